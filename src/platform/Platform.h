@@ -1,0 +1,24 @@
+#pragma once
+
+namespace lumora {
+
+class Clock;
+class Dialogs;
+class EventPump;
+class Files;
+class Internet;
+class Shell;
+class Volume;
+
+// What a page may use of the machine. main() makes one; tests make one of real files in a temporary folder and fakes.
+struct Platform {
+    const Files& files;
+    Dialogs& dialogs;
+    Internet& internet;
+    Shell& shell;
+    const Clock& clock;
+    EventPump& pump;
+    const Volume& volume;
+};
+
+} // namespace lumora

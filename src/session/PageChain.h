@@ -1,0 +1,65 @@
+#pragma once
+
+#include "session/Page.h"
+
+#include <functional>
+#include <map>
+#include <memory>
+#include <vector>
+
+namespace lumora {
+
+class EventPump;
+
+// The chain of pages: which exist, which is in front. A page opens the next by its id and unloads itself.
+class PageChain : public QObject {
+    Q_OBJECT
+public:
+    using Maker = std::function<std::unique_ptr<Page>()>;
+
+    explicit PageChain(const EventPump& pump)
+        : m_pump(pump)
+    {
+    }
+    ~PageChain() override;
+
+    void registerPage(PageId id, Maker maker);
+
+    // The page with this id, made and loaded if it does not exist yet, without bringing it to the front. A service page such as
+    // gdisave is used this way.
+    Page& load(PageId id);
+
+    // Loads the page if need be and brings it to the front. False when no page of that id was registered.
+    bool show(PageId id);
+
+    // Takes the page out of the chain at once and deletes it when all handlers have returned, also those that wait in a pump for the
+    // click that unloads their page. A chain is never without a page in front: when the last one that was shown goes, the start
+    // page comes.
+    void unload(PageId id);
+
+    Page* find(PageId id) const;
+    Page* front() const { return m_shown.empty() ? nullptr : m_shown.back(); }
+    bool isRegistered(PageId id) const { return m_makers.contains(id); }
+
+    // The end of the program: nothing is saved. Whoever runs the process ends it on ended().
+    void endProgram();
+    bool hasEnded() const { return m_ended; }
+
+Q_SIGNALS:
+    void made(lumora::Page* page);
+    void shown(lumora::Page* page);
+    void unloaded(lumora::Page* page);
+    void ended();
+
+private:
+    void deleteLeft();
+
+    const EventPump& m_pump;
+    std::map<PageId, Maker> m_makers;
+    std::map<PageId, std::unique_ptr<Page>> m_pages;
+    std::vector<Page*> m_shown; // the last one is in front
+    std::vector<std::unique_ptr<Page>> m_left; // unloaded, with handlers that may still be running
+    bool m_ended = false;
+};
+
+} // namespace lumora

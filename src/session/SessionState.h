@@ -1,0 +1,186 @@
+#pragma once
+
+#include <QDateTime>
+#include <QString>
+#include <QStringList>
+
+#include <array>
+#include <cstdint>
+#include <optional>
+
+// The state of one run, read by every page. Names are those of the lab's own records; docs/glossary.md tells each in English.
+namespace lumora {
+
+// The client profile: which lab this copy serves. Set by LoadDefaultProfile from the built-in values and the deployment.
+struct ClientProfile {
+    QString FtpFolder1;              // first remote folder level, empty when there is none
+    QString FtpFolder2;              // second remote folder level
+    QString ClientCode;              // short code of the client, key of the reports
+    QString FtpServer;               // host, with an optional port
+    QString FtpPassword;
+    QString FtpUser;
+    QString ServerKey;               // carried by the settings text only
+    std::int16_t JppBase = 0;        // added to the piece length in a print file
+    std::int32_t JppChunks = 0;      // pieces of a print file
+    std::int32_t ProfileNumber = 0;  // carried by the settings text only
+    std::array<QString, 15> SizeList;  // paper sizes on offer, "10/15"; empty entries are skipped
+    std::array<QString, 3> QuickSizes; // the sizes placed in front
+    QString ClientLetter;            // client kind: decides the tiles of the menu
+    QString LabName1;
+    QString LabName2;
+    QString LabMail;
+    QString LabPhone;
+    QString SiteUrl;                 // ends in a slash
+    QString PriceListUrl;
+    QString PriceListUrl2;
+    QString ReportUrl;               // whole address of the report script
+    QString DoneUrl;                 // whole address of the done script, FTP sender
+    QString HttpDoneUrl;             // the same for the HTTP sender, on a host of its own
+    QString SettingsHost;            // host of the remote settings texts
+    QString AdUrl1;
+    QString AdUrl2;
+    QString AdFile1;                 // drive paths
+    QString AdFile2;
+    std::int16_t ReportOn = 0;       // above 0: the reports are sent
+};
+
+// The details of one order.
+struct OrderDetails {
+    QString n1;                      // customer's first and last name
+    QString n2;                      // telephone
+    QString n3;                      // delivery address
+    QString n4;                      // spare, printed behind the telephone
+    QString Mail;
+    QString FillFit;                 // "FIT", "FIL", "NNN" not chosen, "FFF" album
+    QString Hearot;                  // remarks
+    std::optional<QDateTime> T1;     // spare date
+    QString Bord;                    // border code
+    QString ppr;                     // paper size, "10/15"; "***" until chosen; "zz/zz" mixed
+    QString maat;                    // paper kind as the page's language has it; "***" until chosen
+    QString ser;                     // last four characters of the volume serial
+    std::int16_t TotalPics = 0;      // copies in all
+    QString Soog1;                   // a mixed-size order's two kinds
+    QString Soog2;
+    QString CustomCode;              // size code of a special size, four characters; nothing sets it
+    QString TimeOfJob;               // YYYY_MM_DD_SSS_ssss^
+    QString Girsa;                   // version of the record
+};
+
+// A parent album order.
+struct AlbumDetails {
+    QString ShemZalam;               // photographer's name
+    QString ShemErooa;               // name of the event
+    QString TelZalam;                // photographer's telephone
+    QString MailZalam;               // photographer's mail address
+    QString SoogLBM;                 // album kind
+    QString SoogKricha;              // cover
+    QString SoogNiar;                // paper
+    std::array<QString, 5> Tosafot1; // extras
+    std::array<QString, 9> Tosafot2; // special extras
+    QString GodelLBM;                // album size
+    QString HearotLBM;               // spare remark
+    QString KamutHorim;              // copies of the parent album
+    QString SoogHorim;               // size of the parent album
+};
+
+// An order paid by a coupon of a fixed quantity.
+struct CouponState {
+    std::int16_t HaKoopon = 0;       // 1: the quantity is checked
+    std::int16_t MisparKoopon = 0;   // pictures the coupon holds
+    std::int16_t SmallCount = 0;     // quantities of the two sizes of the product
+    std::int16_t LargeCount = 0;
+};
+
+// The picture last opened in the editor: the raw record, 200 characters, and its fields.
+struct EditFields {
+    QString EditState;
+    QString PicturePath;
+    QString TempRedName;
+    float GainR = 1;
+    float GainG = 1;
+    float GainB = 1;
+    std::int16_t RotationCode = 180;
+    std::int16_t ZoomPercent = 100;
+    std::int16_t PanX = 999;
+    std::int16_t PanY = 999;
+    std::int16_t ToneFlag = 0;
+    std::int16_t SpareFlag = 0;
+    QString FrameName;
+    QString LineFrameCode;
+    QString RedMarker;
+    QString AutoMarker;
+    QString FrameFolder;
+    std::int16_t TextFontSize = 8;
+    std::int16_t TextAlign = 0;
+    std::int16_t TextOn = 0;
+    QString Tag;
+    std::int16_t TextBlue = 0;
+    std::int16_t TextGreen = 0;
+    std::int16_t TextRed = 0;
+    std::int16_t TextX = 0;
+    std::int16_t TextY = 0;
+    std::int16_t TextVertical = 0;
+    std::int16_t TextStyle = 0;
+    QString TextFont;
+    QString TextBody;
+};
+
+// What the senders share.
+struct TransferState {
+    QString OrderFolder;             // full drive path of the order's folder
+    QString OrderLogBase;            // path of the order log without ".txt"
+    QString ShemTikiya;              // leaf name of the order folder, also its name on the server
+    std::int16_t HazmanaP = 0;       // above 0: the folder's name ends in "P"
+    std::int16_t SugSheliach = 0;    // sender: 0 FTP, 1 HTTP
+    std::int16_t SugMishloah = 0;    // 0 a new order, 1 a resend, 2 a chain
+    std::int16_t Mefurak = 0;        // 1: the order travels as pieces
+    std::int16_t KeSherLaSharat = 0; // three values that the order log carries and nothing sets
+    QString HitKasherDerech;
+    std::int16_t TaooyotBaHaShvaa = 0;
+    std::int16_t MailFlag = 0;       // cleared at the start of each order
+};
+
+// The lines that one page copies into a list of the next, and what it asks the next page to do with them.
+struct HandOver {
+    QStringList lines;
+    bool pressStart = false;         // the next page presses its own start button once it is shown
+    QString notice;                  // a line for the customer that the start page shows
+};
+
+struct SessionState {
+    QString DiskRoot;                // "C:\", root of all workspace paths
+    std::int16_t Optint = 0;         // order mode: 1, 2, 3, 4, 7, 9 or 10
+    QString MisparHazmana = QStringLiteral("100"); // number of the order being built
+    QString KodMishloach = QStringLiteral("   ");  // how the order started, three characters
+    QString KodMishloachMakor = QStringLiteral("   ");
+    bool MishloachHabaita = false;   // home delivery: the address is required
+    std::int16_t EnglishTips = 0;    // 0 Hebrew, 1 English
+    bool TachanaMekomit = false;     // local station: the order stays in the workspace
+    bool DoarReshut = false;         // the e-mail address is optional
+    std::int16_t MediniyutDchisa = 2; // deep compression of large prints: 1 ask, 2 always
+    std::int16_t DchisaAmoka = 0;    // 1: deep compression is on for this order
+    std::int16_t SugTzad = 40;       // length of the tail of a print file, 40 or 60
+    QString BranchChoice;            // caption of the collection point
+    std::int16_t DeliveryChoiceMode = 0; // 1: the start page asks where the prints are fetched
+    bool FitMuzag = false;           // the fit or fill page is shown
+    std::int16_t GvulMuzag = 1;      // 1: the border page is shown
+    bool DegelEdit = false;          // shows the editor's spare panel
+    std::int16_t MinuyPaar = 1;      // 2: changes the menu
+    std::int16_t TmunatPaar = 0;     // 1: adds a menu tile and a step behind preparation
+    bool ModulRezef = false;         // the order is picked in one sequence, kinds 3 and 10
+    static constexpr int EditStateLength = 200;
+
+    ClientProfile profile;
+    OrderDetails shemot;
+    AlbumDetails album;
+    CouponState coupon;
+    EditFields edit;
+    TransferState transfer;
+    HandOver handOver;
+
+    bool english() const { return EnglishTips == 1; }
+    // The wording in the language of the session.
+    QString wording(const QString& hebrew, const QString& inEnglish) const { return english() ? inEnglish : hebrew; }
+};
+
+} // namespace lumora

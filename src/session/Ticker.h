@@ -1,0 +1,24 @@
+#pragma once
+
+#include <QTimer>
+
+#include <functional>
+
+namespace lumora {
+
+// A timer of a page. A running event loop ticks it; a test ticks by calling the page's handler.
+class Ticker {
+public:
+    Ticker(int milliseconds, std::function<void()> tick);
+
+    void start();
+    void stop() { m_timer.stop(); }
+    bool running() const { return m_timer.isActive(); }
+    int interval() const { return m_timer.interval(); }
+    void setInterval(int milliseconds) { m_timer.setInterval(milliseconds); }
+
+private:
+    QTimer m_timer;
+};
+
+} // namespace lumora

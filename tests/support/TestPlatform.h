@@ -1,0 +1,143 @@
+#pragma once
+
+#include "platform/Dialogs.h"
+#include "platform/Drives.h"
+#include "platform/Files.h"
+#include "platform/Internet.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+
+#include <QStringList>
+#include <QTemporaryDir>
+
+#include <functional>
+
+// A platform for tests: real files in a temporary folder, hand-written fakes for what a person, a clock or a line would answer.
+namespace lumora {
+
+class RecordedDialogs : public Dialogs {
+public:
+    void message(const QString& text, const QString& title = {}) override
+    {
+        messages += text;
+        titles += title;
+    }
+    bool ask(const QString& question) override
+    {
+        questions += question;
+        return !answers.isEmpty() && answers.takeFirst();
+    }
+    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override
+    {
+        pickRequests += prompt + u'|' + initialFolder + u'|' + title;
+        return picks.isEmpty() ? QString() : picks.takeFirst();
+    }
+
+    QStringList messages;
+    QStringList titles;
+    QStringList questions;
+    QStringList pickRequests;
+    QStringList picks;    // answers of the next file dialogs, in order
+    QList<bool> answers;  // answers of the next questions, in order
+};
+
+class FixedClock : public Clock {
+public:
+    QDateTime now() const override { return time; }
+    QDateTime time = QDateTime(QDate(2026, 11, 21), QTime(14, 5, 9));
+};
+
+// Counts the pumps; a test may let something happen at one, as a click that arrives meanwhile.
+class ScriptedPump : public EventPump {
+public:
+    void pump() override
+    {
+        ++count;
+        if (onPump && !m_pumping) {
+            m_pumping = true;
+            onPump();
+            m_pumping = false;
+        }
+    }
+    bool pumping() const override { return m_pumping; }
+
+    int count = 0;
+    std::function<void()> onPump;
+
+private:
+    bool m_pumping = false;
+};
+
+class RecordedShell : public Shell {
+public:
+    void openWebPage(const QString& url) override { webPages += url; }
+    void openFolder(const QString& drivePath) override { folders += drivePath; }
+    void copyToClipboard(const QString& text) override { clipboard = text; }
+
+    QStringList webPages;
+    QStringList folders;
+    QString clipboard;
+};
+
+class FixedVolume : public Volume {
+public:
+    Result<std::int32_t> serial(const QString&) const override
+    {
+        if (fails)
+            return Failure{Failure::Kind::Other, QStringLiteral("no serial")};
+        return number;
+    }
+    std::int32_t number = -987651234;
+    bool fails = false;
+};
+
+// A machine without a line.
+class NoInternet : public Internet {
+public:
+    bool open() override { return false; }
+    bool connectedState() const override { return false; }
+    Result<std::unique_ptr<FtpConnection>> connectFtp(const QString&, const QString&, const QString&, DataChannel) override
+    {
+        return noLine();
+    }
+    Result<QByteArray> fetch(const QString&) override { return noLine(); }
+    Result<void> download(const QString&, const HostPath&) override { return noLine(); }
+
+private:
+    static Failure noLine() { return {Failure::Kind::Disconnected, QStringLiteral("no line")}; }
+};
+
+// The drives C: (in a temporary folder) and Z: with everything that a page asks for.
+class TestPlatform {
+public:
+    TestPlatform()
+        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C', {HostPath(folder.path().toStdString()) / "media"})
+        , files(drives)
+        , platform{files, dialogs, noInternet, shell, clock, pump, volume}
+    {
+        std::filesystem::create_directories(drives.dataFolder());
+        std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
+    }
+    // The same with a line.
+    explicit TestPlatform(Internet& internet)
+        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C', {HostPath(folder.path().toStdString()) / "media"})
+        , files(drives)
+        , platform{files, dialogs, internet, shell, clock, pump, volume}
+    {
+        std::filesystem::create_directories(drives.dataFolder());
+        std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
+    }
+
+    QTemporaryDir folder;
+    Drives drives;
+    Files files;
+    RecordedDialogs dialogs;
+    RecordedShell shell;
+    FixedClock clock;
+    ScriptedPump pump;
+    FixedVolume volume;
+    NoInternet noInternet;
+    Platform platform;
+};
+
+} // namespace lumora
