@@ -4,7 +4,8 @@
 
 namespace lumora {
 
-// What a page has to say or to ask outside its own controls. On screen each is a panel over the page; in tests a recorded text.
+// What a page has to say or to ask outside its own controls. On screen each is a panel over the page; in tests a
+// recorded text.
 class Dialogs {
 public:
     virtual ~Dialogs() = default;
@@ -15,8 +16,8 @@ public:
     // Waits for the answer; a box that is closed without one is a no.
     virtual bool ask(const QString& question) = 0;
 
-    // One picture file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the list.
-    // A character of the path that lies outside the code page comes back as "?".
+    // One picture file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the
+    // list. A character of the path that lies outside the code page comes back as "?".
     virtual QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) = 0;
 };
 

@@ -5,19 +5,20 @@
 #include <QChar>
 #include <QString>
 
+#include <cstdint>
 #include <map>
 #include <optional>
 #include <vector>
 
 namespace lumora {
 
-// The drive letters that the system speaks of, and the folders of this machine that stand behind them: the program's own letter
-// (C: unless the deployment says otherwise) is the data folder, Z: is the root of the file system, and mounted media take the free
-// letters from D: on, so that a memory card shows as a drive.
+// The drive letters that the system speaks of, and the folders of this machine that stand behind them: the program's
+// own letter (C: unless the deployment says otherwise) is the data folder, Z: is the root of the file system, and
+// mounted media take the free letters from D: on, so that a memory card shows as a drive.
 class Drives {
 public:
-    // mediaRoots: folders whose sub-folders are mounted media, as /media/<user>/CARD and /run/media/<user>/CARD. A medium that
-    // appears twice takes one letter; a medium keeps its letter while it stays mounted.
+    // mediaRoots: folders whose sub-folders are mounted media, as /media/<user>/CARD and /run/media/<user>/CARD. A
+    // medium that appears twice takes one letter; a medium keeps its letter while it stays mounted.
     Drives(HostPath dataFolder, QChar programLetter = u'C', std::vector<HostPath> mediaRoots = defaultMediaRoots());
 
     static std::vector<HostPath> defaultMediaRoots();
@@ -40,12 +41,12 @@ public:
     };
     std::vector<Drive> drives() const;
 
-    // No value for a text without a drive letter, for a letter without a folder, and for a path that leaves its drive by "..".
-    // A long leaf name is shortened by the rule of ShortenedName, the same at each call.
+    // No value for a text without a drive letter, for a letter without a folder, and for a path that leaves its drive
+    // by "..". A long leaf name is shortened by the rule of ShortenedName, the same at each call.
     std::optional<HostPath> toHost(const QString& drivePath) const;
 
-    // The drive path with the deepest matching drive; Z: serves for what lies on no other. Names of bytes that are no UTF-8 keep
-    // their bytes: they come back from toHost as they were.
+    // The drive path with the deepest matching drive; Z: serves for what lies on no other. Names of bytes that are no
+    // UTF-8 keep their bytes: they come back from toHost as they were.
     QString toDrive(const HostPath& hostPath) const;
 
 private:
@@ -55,9 +56,9 @@ private:
     std::map<QChar, HostPath> m_media;
 };
 
-// A file name may have 255 bytes here, and a flat name made of a whole path in Hebrew takes two bytes a letter. A longer name is cut
-// and closed with "~" and eight hexadecimal digits of a checksum of the whole, before its ending of up to five characters, so
-// that two names that differ stay different.
+// A file name may have 255 bytes here, and a flat name made of a whole path in Hebrew takes two bytes a letter. A
+// longer name is cut and closed with "~" and eight hexadecimal digits of a checksum of the whole, before its ending of
+// up to five characters, so that two names that differ stay different.
 QString ShortenedName(const QString& name);
 
 } // namespace lumora

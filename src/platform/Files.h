@@ -9,18 +9,17 @@
 
 namespace lumora {
 
-// Files and folders under drive paths. A failure's message names the path and the reason. Folders are made with mode 0700, since
-// the workspace holds customers' personal data.
+// Files and folders under drive paths. A failure's message names the path and the reason. Folders are made with mode
+// 0700, since the workspace holds customers' personal data.
 class Files {
 public:
     explicit Files(const Drives& drives)
-        : m_drives(drives)
-    {
-    }
+        : m_drives(drives) {}
 
     const Drives& drives() const { return m_drives; }
 
-    // A path that holds a "?" counts as absent: the "?" is what a character outside the code page has become.
+    // A path that holds a "?" counts as absent, here and in every call below: the "?" is what a character outside the
+    // code page has become.
     bool fileExists(const QString& path) const;
     bool folderExists(const QString& path) const;
 
@@ -30,8 +29,8 @@ public:
 
     Result<QByteArray> read(const QString& path) const;
 
-    // To a temporary file in the same folder, synced, then renamed: a crash or a full disk leaves the old file or the new one and
-    // never half a file.
+    // To a temporary file in the same folder, synced, then renamed: a crash or a full disk leaves the old file or the
+    // new one and never half a file.
     Result<void> writeWhole(const QString& path, const QByteArray& bytes) const;
 
     // Copies whole, in the same way. The source is opened for reading only.
@@ -39,10 +38,10 @@ public:
 
     Result<qint64> size(const QString& path) const;
 
-    // Leaf names of the files that match one of the patterns, joined by ";" ("*.gbr;*.jpp"); "*.*" and "*" match every name. Letter
-    // case does not count. Hidden files (a leading dot) and folders are left out. Sorted by name without regard to case, "!" before
-    // digits before letters. A name with a character outside the code page comes with "?" in its place. A folder that is missing
-    // or may not be read gives no names.
+    // Leaf names of the files that match one of the patterns, joined by ";" ("*.gbr;*.jpp"); "*.*" and "*" match every
+    // name. Letter case does not count. Hidden files (a leading dot) and folders are left out. Sorted by name without
+    // regard to case, "!" before digits before letters. A name with a character outside the code page comes with "?" in
+    // its place. A folder that is missing or may not be read gives no names.
     QStringList names(const QString& folder, const QString& patterns) const;
 
     // Leaf names of the sub-folders, sorted in the same way.
@@ -53,18 +52,18 @@ public:
     QStringList collect(const QString& folder, Depth depth) const;
 
 private:
+    Result<HostPath> host(const QString& path) const;
+
     const Drives& m_drives;
 };
 
-// The working file list of a page: a folder and a pattern, and a snapshot of the matching names that stays as it is until the folder or
-// the pattern is set or refresh is called.
+// The working file list of a page: a folder and a pattern, and a snapshot of the matching names that stays as it is
+// until the folder or the pattern is set or refresh is called.
 class FileList {
 public:
     explicit FileList(const Files& files, QString pattern = QStringLiteral("*.*"))
         : m_files(files)
-        , m_pattern(std::move(pattern))
-    {
-    }
+        , m_pattern(std::move(pattern)) {}
 
     void setFolder(const QString& folder);
     void setPattern(const QString& patterns);

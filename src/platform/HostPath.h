@@ -10,8 +10,13 @@ namespace lumora {
 // turns one into the other.
 using HostPath = std::filesystem::path;
 
-// For messages and for Qt's own file classes.
+// The path as text, and back. Bytes that are no UTF-8 survive the way there and back as lone surrogates; in the code
+// page each of them becomes a "?".
 QString toText(const HostPath& path);
 HostPath toHostPath(const QString& text);
+
+// One name of a path as it stands in a drive path: a backslash inside the name, which would part it in two there, is
+// carried like a byte that is no UTF-8.
+QString toDriveName(const HostPath& name);
 
 } // namespace lumora

@@ -9,10 +9,10 @@
 #include <memory>
 #include <vector>
 
-// The calls that the transfer makes over the line, in the manner of a session: open, connect, walk, put, list. Each call
-// blocks; meanwhile the page may repaint but takes no clicks. Time limits: 30 s to connect, 60 s without a byte or a reply; both
-// end in the failure that a refused call gives. Texts go over the wire in the ANSI code page. A name that holds CR, LF or NUL
-// is refused before anything is sent.
+// The calls that the transfer makes over the line, in the manner of a session: open, connect, walk, put, list. Each
+// call blocks; meanwhile the page may repaint but takes no clicks. Time limits: 30 s to connect, 60 s without a byte or
+// a reply; both end in the failure that a refused call gives. Texts go over the wire in the ANSI code page. A name that
+// holds CR, LF or NUL is refused before anything is sent.
 namespace lumora {
 
 struct FtpEntry {
@@ -30,13 +30,14 @@ public:
     virtual Result<QString> currentDirectory() = 0;
     virtual Result<void> makeDirectory(const QString& name) = 0;
 
-    // Transfer type ASCII on the wire, bytes as they are: the lab's server takes them so, and pictures survive only that way.
+    // Transfer type ASCII on the wire, bytes as they are: the lab's server takes them so, and pictures survive only
+    // that way.
     virtual Result<void> put(const HostPath& local, const QString& remoteName) = 0;
     virtual Result<void> get(const QString& remoteName, const HostPath& local) = 0;
     virtual Result<void> remove(const QString& remoteName) = 0;
 
-    // The entries of the current directory, "." and ".." as the server gives them. The pattern "*.*" means every name and is sent as
-    // a plain LIST, since a server would otherwise hide the names without a dot.
+    // The entries of the current directory, "." and ".." as the server gives them. The pattern "*.*" means every name
+    // and is sent as a plain LIST, since a server would otherwise hide the names without a dot.
     virtual Result<std::vector<FtpEntry>> list(const QString& pattern) = 0;
 
     // The server's last reply, all lines.
@@ -56,8 +57,8 @@ public:
     virtual Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user,
                                                               const QString& password, DataChannel channel) = 0;
 
-    // GET, past every cache. The URL goes out as it stands, in the ANSI code page, only a blank as %20; CR, LF and NUL count as
-    // blanks and "#" does not cut. The answer's body whatever the status is.
+    // GET, past every cache. The URL goes out as it stands, in the ANSI code page, only a blank as %20; CR, LF and NUL
+    // count as blanks and "#" does not cut. The answer's body whatever the status is.
     virtual Result<QByteArray> fetch(const QString& url) = 0;
 
     // GET into a file, written whole or not at all; an answer of 400 or more is a failure and leaves no file.

@@ -16,7 +16,8 @@ public:
     virtual QDateTime now() const = 0;
 };
 
-// Long loops yield here: pending events are handled and the page is painted, so that a click or a timer may run between two steps.
+// Long loops yield here: pending events are handled and the page is painted, so that a click or a timer may run between
+// two steps.
 class EventPump {
 public:
     virtual ~EventPump() = default;
