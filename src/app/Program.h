@@ -1,0 +1,52 @@
+#pragma once
+
+#include "common/Result.h"
+#include "platform/HostPath.h"
+
+#include <QSize>
+
+#include <memory>
+#include <optional>
+
+namespace lumora {
+
+class MainWindow;
+class PageChain;
+class ScreenDialogs;
+struct Platform;
+struct SessionState;
+
+struct ProgramOptions {
+    std::optional<HostPath> labFile;    // the deployment file; without one the usual places are looked through
+    std::optional<HostPath> dataFolder; // what stands behind the program's own drive letter
+    QSize windowSize;                   // an empty one leaves the size to the screen
+    bool fullScreen = false;
+};
+
+// One run of the program: the session, the machine, the chain of pages and the window. Needs an Application (in
+// views/). A program that presses controls instead of a person runs the very same.
+class Program {
+public:
+    explicit Program(ProgramOptions options);
+    ~Program();
+    Program(const Program&) = delete;
+    Program& operator=(const Program&) = delete;
+
+    // Reads the deployment file, opens the window and brings the start page to the front. A failure tells file,
+    // line, key and what is allowed, and no window was opened then. The end of the page chain quits the application.
+    Result<void> start();
+
+    // Valid once start() has succeeded.
+    SessionState& state();
+    PageChain& chain();
+    MainWindow& window();
+    ScreenDialogs& dialogs();
+    const Platform& platform() const;
+
+private:
+    struct Parts;
+    ProgramOptions m_options;
+    std::unique_ptr<Parts> m_parts;
+};
+
+} // namespace lumora

@@ -1,0 +1,53 @@
+#pragma once
+
+#include "common/Result.h"
+
+#include <QPoint>
+#include <QString>
+
+class QWidget;
+
+namespace lumora {
+
+class MainWindow;
+class PageView;
+
+// Controls by their design names ("Command12", "Picture1(3)"), used as a person uses them: an operation fails, and
+// tells why, unless the control is there, visible, enabled and not covered by anything else.
+class ControlFinder {
+public:
+    explicit ControlFinder(MainWindow& window)
+        : m_window(window) {}
+
+    // The name of the page in front, "" when there is none.
+    QString frontPage() const;
+
+    // Each takes the page's name; a page that is not in front is a failure.
+    Result<void> press(const QString& page, const QString& control) const;
+    Result<void> doublePress(const QString& page, const QString& control) const;
+    // Replaces what the text box holds.
+    Result<void> type(const QString& page, const QString& control, const QString& text) const;
+    // The row of a list or of a combo box with this text.
+    Result<void> choose(const QString& page, const QString& control, const QString& text) const;
+    Result<void> tick(const QString& page, const QString& control, bool on) const;
+
+    // What the page says of the control: its caption, the text of a box, the current row of a list. Also for controls
+    // that are hidden.
+    Result<QString> text(const QString& page, const QString& control) const;
+    Result<bool> visible(const QString& page, const QString& control) const;
+    Result<bool> enabled(const QString& page, const QString& control) const;
+    // Of lists, also of working lists that nobody sees.
+    Result<int> count(const QString& page, const QString& control) const;
+    Result<QString> item(const QString& page, const QString& control, int index) const;
+
+    // Why a mouse press in the middle of the widget would not reach it; empty when it would.
+    static QString whyNotPressable(const QWidget& widget);
+
+private:
+    Result<PageView*> view(const QString& page) const;
+    Result<QWidget*> pressable(const QString& page, const QString& control) const;
+
+    MainWindow& m_window;
+};
+
+} // namespace lumora

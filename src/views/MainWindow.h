@@ -1,0 +1,67 @@
+#pragma once
+
+#include "session/Page.h"
+#include "views/Theme.h"
+
+#include <QPointer>
+#include <QWidget>
+
+#include <functional>
+#include <map>
+#include <memory>
+#include <vector>
+
+class QStackedLayout;
+
+namespace lumora {
+
+class PageChain;
+class PageView;
+struct SessionState;
+
+// The program's one window. It follows the page chain: the view of the page in front is shown, a view lives as long as
+// its page, and a page that nobody sees has none. All sizes of a view come from one factor, which follows the window;
+// when it changes, the views are built anew from their pages.
+class MainWindow : public QWidget {
+    Q_OBJECT
+public:
+    using ViewMaker = std::function<std::unique_ptr<PageView>(Page&, const Theme&)>;
+
+    MainWindow(PageChain& chain, const SessionState& state);
+    ~MainWindow() override;
+
+    void registerView(PageId id, ViewMaker maker);
+
+    PageView* frontView() const { return m_front; }
+    PageView* viewOf(const Page& page) const;
+    const Theme& theme() const { return *m_theme; }
+
+    // Renders what waits for the next turn of the event loop, at once.
+    void renderNow();
+
+Q_SIGNALS:
+    // The theme, and with it every size, has changed.
+    void themeChanged();
+    void frontChanged();
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+    void closeEvent(QCloseEvent* event) override;
+
+private:
+    void pageShown(Page* page);
+    void pageUnloaded(Page* page);
+    PageView* make(Page& page);
+    void rebuild();
+    void bringToFront(PageView* view);
+
+    PageChain& m_chain;
+    const SessionState& m_state;
+    std::unique_ptr<Theme> m_theme;
+    std::map<PageId, ViewMaker> m_makers;
+    std::map<const Page*, PageView*> m_views;
+    QStackedLayout* m_stack = nullptr;
+    PageView* m_front = nullptr;
+};
+
+} // namespace lumora

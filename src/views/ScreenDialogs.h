@@ -1,0 +1,58 @@
+#pragma once
+
+#include "platform/Dialogs.h"
+
+#include <QObject>
+#include <QPointer>
+#include <QStringList>
+
+#include <functional>
+#include <optional>
+
+namespace lumora {
+
+class Files;
+class MainWindow;
+class MessagePanel;
+struct SessionState;
+
+// The boxes of the program as panels over the page. Messages queue up and the page goes on below them; a question and
+// the picture picker wait for the answer in an event loop of their own, which stands here and nowhere else.
+class ScreenDialogs : public QObject, public Dialogs {
+    Q_OBJECT
+public:
+    ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files);
+    ~ScreenDialogs() override;
+
+    void message(const QString& text, const QString& title = {}) override;
+    bool ask(const QString& question) override;
+    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override;
+
+    // Answers given in place of a person's; no value lets the panel come up. A pick is a drive path, empty for a
+    // cancel.
+    std::function<std::optional<QString>()> nextPick;
+    std::function<std::optional<bool>()> nextAnswer;
+
+    // Every box and question so far, oldest first.
+    QStringList shownTexts;
+    // The box in front, empty when there is none.
+    QString frontText() const;
+    // As if the person had closed every box that is open or waits.
+    void closeMessages();
+
+private:
+    struct Box {
+        QString text;
+        QString title;
+    };
+    void showNext();
+    QString closingText() const;
+
+    MainWindow& m_window;
+    const SessionState& m_state;
+    const Files& m_files;
+    QList<Box> m_waiting;
+    QPointer<MessagePanel> m_panel;
+};
+
+} // namespace lumora

@@ -1,0 +1,80 @@
+#pragma once
+
+#include <QColor>
+#include <QFont>
+#include <QIcon>
+#include <QPixmap>
+#include <QString>
+
+#include <map>
+#include <utility>
+
+class QApplication;
+
+namespace lumora {
+
+// The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
+class Theme {
+public:
+    // Ink on Paper, Ink and Muted on Surface, and white on Primary and Danger keep a contrast of 4.5 or more.
+    struct Colour {
+        static constexpr QColor Paper{0xF5, 0xF3, 0xEE};   // behind everything
+        static constexpr QColor Surface{0xFF, 0xFF, 0xFF}; // cards, fields
+        static constexpr QColor Sunken{0xEC, 0xE9, 0xE1};  // wells, tracks
+        static constexpr QColor Line{0xD5, 0xD0, 0xC5};    // hairlines
+        static constexpr QColor Edge{0x8A, 0x86, 0x7C};    // outlines of what can be pressed (3:1)
+        static constexpr QColor Ink{0x1D, 0x25, 0x2C};     // text
+        static constexpr QColor Muted{0x57, 0x5F, 0x66};   // second text
+        static constexpr QColor Primary{0x0E, 0x66, 0x6B}; // the main action, what is chosen
+        static constexpr QColor PrimaryDark{0x0A, 0x4E, 0x52};
+        static constexpr QColor PrimarySoft{0xDD, 0xEE, 0xED};
+        static constexpr QColor Sun{0xF2, 0xA9, 0x3B}; // the one warm accent; never a text colour
+        static constexpr QColor SunSoft{0xFD, 0xF0, 0xD9};
+        static constexpr QColor Danger{0xB2, 0x32, 0x2A};
+        static constexpr QColor DangerSoft{0xFB, 0xE6, 0xE3};
+        static constexpr QColor Good{0x2B, 0x70, 0x3F};
+        static constexpr QColor GoodSoft{0xE1, 0xF1, 0xE4};
+        static constexpr QColor Focus{0x1F, 0x5F, 0xE0};      // the ring around the control that has the keyboard
+        static constexpr QColor Veil{0x1D, 0x25, 0x2C, 0x99}; // over a page that has a panel in front
+    };
+
+    // Of the largest logical page that fits the window.
+    static double factorFor(QSize window);
+
+    explicit Theme(double factor)
+        : m_factor(factor) {}
+
+    double factor() const { return m_factor; }
+    int px(double length) const;
+
+    // Spacing.
+    int gap() const { return px(12); }
+    int wideGap() const { return px(24); }
+    int margin() const { return px(28); }
+    int corner() const { return px(14); }
+    // No control that can be pressed is smaller than this, on any window.
+    int target() const { return px(48) < 44 ? 44 : px(48); }
+    int mainActionHeight() const { return px(60); }
+
+    enum class Type { Small, Body, Strong, Large, Title, Display };
+    QFont font(Type type) const;
+
+    // One of our own drawings (views/icons), in one colour.
+    QPixmap icon(const QString& name, int size, QColor colour) const;
+    QIcon buttonIcon(const QString& name, int size, QColor colour, QColor whenDisabled) const;
+
+    QString styleSheet() const;
+
+    // Fonts, palette and style of the application.
+    static void apply(QApplication& application);
+
+private:
+    double m_factor;
+    mutable std::map<std::pair<QString, std::pair<int, QRgb>>, QPixmap> m_icons;
+};
+
+// A line of text with the places that must keep their own direction (sizes, paths, addresses, "3 / 12") set apart, so
+// that a sentence in Hebrew does not turn them over.
+QString isolated(const QString& text);
+
+} // namespace lumora
