@@ -8,62 +8,80 @@
 #include <cstdint>
 #include <optional>
 
-// The state of one run, read by every page. Names are those of the lab's own records; docs/glossary.md tells each in English.
+// The state of one run, read by every page. Names are those of the lab's own records; docs/glossary.md tells each in
+// English.
 namespace lumora {
 
-// The client profile: which lab this copy serves. Set by LoadDefaultProfile from the built-in values and the deployment.
+// A shop of the delivery question on the start page.
+struct Shop {
+    QString name;
+    QString phone;
+};
+
+// A branch at which a coupon order is fetched: the button's caption and what its card says.
+struct Branch {
+    QString caption;
+    QString name;
+    std::array<QString, 2> address; // up to two lines
+    QString phone;
+};
+
+// The client profile: which lab this copy serves. Set by LoadDefaultProfile from the built-in values and the
+// deployment.
 struct ClientProfile {
-    QString FtpFolder1;              // first remote folder level, empty when there is none
-    QString FtpFolder2;              // second remote folder level
-    QString ClientCode;              // short code of the client, key of the reports
-    QString FtpServer;               // host, with an optional port
+    QString FtpFolder1; // first remote folder level, empty when there is none
+    QString FtpFolder2; // second remote folder level
+    QString ClientCode; // short code of the client, key of the reports
+    QString FtpServer;  // host, with an optional port
     QString FtpPassword;
     QString FtpUser;
-    QString ServerKey;               // carried by the settings text only
-    std::int16_t JppBase = 0;        // added to the piece length in a print file
-    std::int32_t JppChunks = 0;      // pieces of a print file
-    std::int32_t ProfileNumber = 0;  // carried by the settings text only
+    QString ServerKey;                 // carried by the settings text only
+    std::int16_t JppBase = 0;          // added to the piece length in a print file
+    std::int32_t JppChunks = 0;        // pieces of a print file
+    std::int32_t ProfileNumber = 0;    // carried by the settings text only
     std::array<QString, 15> SizeList;  // paper sizes on offer, "10/15"; empty entries are skipped
     std::array<QString, 3> QuickSizes; // the sizes placed in front
-    QString ClientLetter;            // client kind: decides the tiles of the menu
+    QString ClientLetter;              // client kind: decides the tiles of the menu
     QString LabName1;
     QString LabName2;
     QString LabMail;
     QString LabPhone;
-    QString SiteUrl;                 // ends in a slash
+    QString SiteUrl; // ends in a slash
     QString PriceListUrl;
     QString PriceListUrl2;
-    QString ReportUrl;               // whole address of the report script
-    QString DoneUrl;                 // whole address of the done script, FTP sender
-    QString HttpDoneUrl;             // the same for the HTTP sender, on a host of its own
-    QString SettingsHost;            // host of the remote settings texts
+    QString ReportUrl;    // whole address of the report script
+    QString DoneUrl;      // whole address of the done script, FTP sender
+    QString HttpDoneUrl;  // the same for the HTTP sender, on a host of its own
+    QString SettingsHost; // host of the remote settings texts
     QString AdUrl1;
     QString AdUrl2;
-    QString AdFile1;                 // drive paths
+    QString AdFile1; // drive paths
     QString AdFile2;
     std::int16_t ReportOn = 0;       // above 0: the reports are sent
+    std::array<Shop, 2> Shops;       // rows of the delivery question
+    std::array<Branch, 11> Branches; // ten shops, then home delivery
 };
 
 // The details of one order.
 struct OrderDetails {
-    QString n1;                      // customer's first and last name
-    QString n2;                      // telephone
-    QString n3;                      // delivery address
-    QString n4;                      // spare, printed behind the telephone
+    QString n1; // customer's first and last name
+    QString n2; // telephone
+    QString n3; // delivery address
+    QString n4; // spare, printed behind the telephone
     QString Mail;
-    QString FillFit;                 // "FIT", "FIL", "NNN" not chosen, "FFF" album
-    QString Hearot;                  // remarks
-    std::optional<QDateTime> T1;     // spare date
-    QString Bord;                    // border code
-    QString ppr;                     // paper size, "10/15"; "***" until chosen; "zz/zz" mixed
-    QString maat;                    // paper kind as the page's language has it; "***" until chosen
-    QString ser;                     // last four characters of the volume serial
-    std::int16_t TotalPics = 0;      // copies in all
-    QString Soog1;                   // a mixed-size order's two kinds
+    QString FillFit;             // "FIT", "FIL", "NNN" not chosen, "FFF" album
+    QString Hearot;              // remarks
+    std::optional<QDateTime> T1; // spare date
+    QString Bord;                // border code
+    QString ppr;                 // paper size, "10/15"; "***" until chosen; "zz/zz" mixed
+    QString maat;                // paper kind as the page's language has it; "***" until chosen
+    QString ser;                 // last four characters of the volume serial
+    std::int16_t TotalPics = 0;  // copies in all
+    QString Soog1;               // a mixed-size order's two kinds
     QString Soog2;
-    QString CustomCode;              // size code of a special size, four characters; nothing sets it
-    QString TimeOfJob;               // YYYY_MM_DD_SSS_ssss^
-    QString Girsa;                   // version of the record
+    QString CustomCode; // size code of a special size, four characters; nothing sets it
+    QString TimeOfJob;  // YYYY_MM_DD_SSS_ssss^
+    QString Girsa;      // version of the record
 };
 
 // A parent album order.
@@ -85,9 +103,9 @@ struct AlbumDetails {
 
 // An order paid by a coupon of a fixed quantity.
 struct CouponState {
-    std::int16_t HaKoopon = 0;       // 1: the quantity is checked
-    std::int16_t MisparKoopon = 0;   // pictures the coupon holds
-    std::int16_t SmallCount = 0;     // quantities of the two sizes of the product
+    std::int16_t HaKoopon = 0;     // 1: the quantity is checked
+    std::int16_t MisparKoopon = 0; // pictures the coupon holds
+    std::int16_t SmallCount = 0;   // quantities of the two sizes of the product
     std::int16_t LargeCount = 0;
 };
 
@@ -137,37 +155,37 @@ struct TransferState {
     std::int16_t KeSherLaSharat = 0; // three values that the order log carries and nothing sets
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;
-    std::int16_t MailFlag = 0;       // cleared at the start of each order
+    std::int16_t MailFlag = 0; // cleared at the start of each order
 };
 
 // The lines that one page copies into a list of the next, and what it asks the next page to do with them.
 struct HandOver {
     QStringList lines;
-    bool pressStart = false;         // the next page presses its own start button once it is shown
-    QString notice;                  // a line for the customer that the start page shows
+    bool pressStart = false; // the next page presses its own start button once it is shown
+    QString notice;          // a line for the customer that the start page shows
 };
 
 struct SessionState {
-    QString DiskRoot;                // "C:\", root of all workspace paths
-    std::int16_t Optint = 0;         // order mode: 1, 2, 3, 4, 7, 9 or 10
+    QString DiskRoot;                              // "C:\", root of all workspace paths
+    std::int16_t Optint = 0;                       // order mode: 1, 2, 3, 4, 7, 9 or 10
     QString MisparHazmana = QStringLiteral("100"); // number of the order being built
     QString KodMishloach = QStringLiteral("   ");  // how the order started, three characters
     QString KodMishloachMakor = QStringLiteral("   ");
-    bool MishloachHabaita = false;   // home delivery: the address is required
-    std::int16_t EnglishTips = 0;    // 0 Hebrew, 1 English
-    bool TachanaMekomit = false;     // local station: the order stays in the workspace
-    bool DoarReshut = false;         // the e-mail address is optional
-    std::int16_t MediniyutDchisa = 2; // deep compression of large prints: 1 ask, 2 always
-    std::int16_t DchisaAmoka = 0;    // 1: deep compression is on for this order
-    std::int16_t SugTzad = 40;       // length of the tail of a print file, 40 or 60
-    QString BranchChoice;            // caption of the collection point
+    bool MishloachHabaita = false;       // home delivery: the address is required
+    std::int16_t EnglishTips = 0;        // 0 Hebrew, 1 English
+    bool TachanaMekomit = false;         // local station: the order stays in the workspace
+    bool DoarReshut = false;             // the e-mail address is optional
+    std::int16_t MediniyutDchisa = 2;    // deep compression of large prints: 1 ask, 2 always
+    std::int16_t DchisaAmoka = 0;        // 1: deep compression is on for this order
+    std::int16_t SugTzad = 40;           // length of the tail of a print file, 40 or 60
+    QString BranchChoice;                // caption of the collection point
     std::int16_t DeliveryChoiceMode = 0; // 1: the start page asks where the prints are fetched
-    bool FitMuzag = false;           // the fit or fill page is shown
-    std::int16_t GvulMuzag = 1;      // 1: the border page is shown
-    bool DegelEdit = false;          // shows the editor's spare panel
-    std::int16_t MinuyPaar = 1;      // 2: changes the menu
-    std::int16_t TmunatPaar = 0;     // 1: adds a menu tile and a step behind preparation
-    bool ModulRezef = false;         // the order is picked in one sequence, kinds 3 and 10
+    bool FitMuzag = false;               // the fit or fill page is shown
+    std::int16_t GvulMuzag = 1;          // 1: the border page is shown
+    bool DegelEdit = false;              // shows the editor's spare panel
+    std::int16_t MinuyPaar = 1;          // 2: changes the menu
+    std::int16_t TmunatPaar = 0;         // 1: adds a menu tile and a step behind preparation
+    bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
     static constexpr int EditStateLength = 200;
 
     ClientProfile profile;

@@ -1,0 +1,33 @@
+#pragma once
+
+#include "session/SessionState.h"
+
+namespace lumora {
+
+// What the installer of a lab decides, once for a machine. Each value starts as the built-in default; LabFile replaces
+// those that the lab's file gives, and LoadDefaultProfile sets the session from it.
+struct Deployment {
+    Deployment();
+
+    // Folders of the advertising pictures follow the drive root, which is known at run time: AdFile1 and AdFile2 stay
+    // empty here. AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
+    ClientProfile profile;
+
+    std::int16_t SugSheliach = 0;
+    std::int16_t HaKoopon = 0;
+    std::int16_t DeliveryChoiceMode = 0;
+    bool TachanaMekomit = false;
+    bool DoarReshut = false;
+    std::int16_t MediniyutDchisa = 2;
+    std::int16_t GvulMuzag = 1;
+    bool FitMuzag = false;
+    std::int16_t TmunatPaar = 0;
+    std::int16_t MinuyPaar = 1;
+    std::int16_t SugTzad = 40;
+
+    QChar programLetter = u'C'; // letter of the program's own drive
+    QString dataFolder;         // host folder behind it; empty: the user's data folder
+    QString driveOrder; // letters in the order in which drives are offered, "EDZ"; the others follow; empty: by letter
+};
+
+} // namespace lumora
