@@ -14,9 +14,10 @@ class UploadRoom;
 struct Platform;
 struct SessionState;
 
-// The sending page: takes one finished order folder and gets all of its files onto the lab's server. It lists them, counts down,
-// sends each on a connection of its own, then looks at what arrived and goes round again for what did not, four times in all. Success
-// sends the two reports. A stop or a failure leaves the local folder as it is, so that the order can be sent again.
+// The sending page: takes one finished order folder and gets all of its files onto the lab's server. It lists them,
+// counts down, sends each on a connection of its own, then looks at what arrived and goes round again for what did not,
+// four times in all. Success sends the two reports. A stop or a failure leaves the local folder as it is, so that the
+// order can be sent again.
 class FtpFrm : public Page, public FtpBoard {
     Q_OBJECT
 public:
@@ -27,41 +28,41 @@ public:
     void setTexts() override;
 
     // Events.
-    void Form_Activate();     // the page has come up: a new order or a resend begins by itself
-    void Timer1_Tick();       // one second of the countdown
-    void Timer2_Tick();       // blinks
-    void Command12_Click();   // send: up to four attempts
-    void Command10_Click();   // send again, all that is missing
-    void Image5_Click();      // send now, without waiting for the countdown
-    void Command23_Click();   // stop the countdown, go on with it
-    void Command18_Click();   // stop the countdown
-    void Command15_Click();   // stop the sending
-    void Command21_Click();   // stop the sending
-    void Image3_Click();      // close
-    void Command14_Click();   // do not close after all
-    void Command16_Click();   // close although nothing was sent
-    void Command11_Click();   // exit
-    void Command8_Click();    // exit
-    void Command28_Click();   // a new order
-    void Image4_Click();      // order number to the clipboard, folder on the screen
-    void Command24_Click();   // show the hidden area
-    void Command9_Click();    // hide it
-    void Command22_Click();   // "press here in case of a communication fault"
+    void Form_Activate();   // the page has come up: a new order or a resend begins by itself
+    void Timer1_Tick();     // one second of the countdown
+    void Timer2_Tick();     // blinks
+    void Command12_Click(); // send: up to four attempts
+    void Command10_Click(); // send again, all that is missing
+    void Image5_Click();    // send now, without waiting for the countdown
+    void Command23_Click(); // stop the countdown, go on with it
+    void Command18_Click(); // stop the countdown
+    void Command15_Click(); // stop the sending
+    void Command21_Click(); // stop the sending
+    void Image3_Click();    // close
+    void Command14_Click(); // do not close after all
+    void Command16_Click(); // close although nothing was sent
+    void Command11_Click(); // exit
+    void Command8_Click();  // exit
+    void Command28_Click(); // a new order
+    void Image4_Click();    // order number to the clipboard, folder on the screen
+    void Command24_Click(); // show the hidden area
+    void Command9_Click();  // hide it
+    void Command22_Click(); // "press here in case of a communication fault"
 
     // Events of the hidden area.
-    void Command13_Click();   // before sending: a new order
-    void Command1_Click();    // before sending: a resend
-    void Command2_Click();    // older bulk path: refill and send
-    void Command4_Click();    // older bulk path: up to three rounds
-    void Command17_Click();   // one order of the chain
-    void Command19_Click();   // all orders of the chain
-    void Command25_Click();   // BdikaAfterUploadB: what of the chosen order has arrived
-    void Command26_Click();   // shows the proof picture
-    void Command27_Click();   // copy
-    void Command3_Click();    // put
-    void Command5_Click();    // get
-    void Command6_Click();    // delete
-    void Command7_Click();    // make dir
+    void Command13_Click(); // before sending: a new order
+    void Command1_Click();  // before sending: a resend
+    void Command2_Click();  // older bulk path: refill and send
+    void Command4_Click();  // older bulk path: up to three rounds
+    void Command17_Click(); // one order of the chain
+    void Command19_Click(); // all orders of the chain
+    void Command25_Click(); // BdikaAfterUploadB: what of the chosen order has arrived
+    void Command26_Click(); // shows the proof picture
+    void Command27_Click(); // copy
+    void Command3_Click();  // put
+    void Command5_Click();  // get
+    void Command6_Click();  // delete
+    void Command7_Click();  // make dir
     void cmdInternetOpen_Click();
     void cmdClosehOpen_Click();
     void optBin_Click();
@@ -73,8 +74,8 @@ public:
 
     // State: see FtpBoard. The file list of the order folder and the timers stand here.
     FileList File1;
-    Ticker Timer1; // 1000 ms
-    Ticker Timer2; // 500 ms
+    Ticker Timer1;              // 1000 ms
+    Ticker Timer2;              // 500 ms
     std::int16_t AllDone = 0;   // 1 after success; read by the close button
     std::int16_t NumToSend = 0; // number of files that make up the order
 
