@@ -8,18 +8,15 @@
 
 namespace lumora {
 
-QString LeftField(const QString& text, int width)
-{
+QString LeftField(const QString& text, int width) {
     return text.leftJustified(width, u' ', true);
 }
 
-QString RightPart(const QString& text, int width)
-{
+QString RightPart(const QString& text, int width) {
     return text.right(width);
 }
 
-double Val(const QString& text)
-{
+double Val(const QString& text) {
     QString number;
     bool point = false;
     bool exponent = false;
@@ -34,7 +31,8 @@ double Val(const QString& text)
         } else if (c == u'.' && !point && !exponent) {
             point = true;
             number += c;
-        } else if ((c == u'e' || c == u'E' || c == u'd' || c == u'D') && !exponent && before >= u'0' && before <= u'9') {
+        } else if ((c == u'e' || c == u'E' || c == u'd' || c == u'D') && !exponent && before >= u'0' &&
+                   before <= u'9') {
             exponent = true;
             number += u'e';
         } else {
@@ -53,30 +51,27 @@ double Val(const QString& text)
                                                         : 0.0;
 }
 
-std::int16_t Val16(const QString& text)
-{
+std::int16_t Val16(const QString& text) {
     return HoldIn16Bits(Val(text));
 }
 
-std::int16_t HoldIn16Bits(double value)
-{
+std::int16_t HoldIn16Bits(double value) {
+    if (std::isnan(value))
+        return 0;
     const double rounded = std::nearbyint(value);
     return static_cast<std::int16_t>(std::clamp(rounded, -32768.0, 32767.0));
 }
 
-long long RoundHalfEven(double value)
-{
+long long RoundHalfEven(double value) {
     return std::llrint(value);
 }
 
-QString ZeroPadded(long long number, int width)
-{
+QString ZeroPadded(long long number, int width) {
     return QString::number(number).rightJustified(width, u'0').right(width);
 }
 
-QString PlainNumber(float number)
-{
-    if (number == 0.0F)
+QString PlainNumber(float number) {
+    if (number == 0.0F || !std::isfinite(number))
         return QStringLiteral("0");
     const int magnitude = static_cast<int>(std::floor(std::log10(std::fabs(static_cast<double>(number)))));
     QString text = QString::number(static_cast<double>(number), 'f', std::clamp(6 - magnitude, 0, 60));
@@ -89,38 +84,35 @@ QString PlainNumber(float number)
     return text;
 }
 
-QString SizeCode(const QString& paper)
-{
+QString SizeCode(const QString& paper) {
     return paper.left(2) + paper.right(2);
 }
 
-bool HasQuestionMark(const QString& text)
-{
+bool HasQuestionMark(const QString& text) {
     return text.contains(u'?');
 }
 
-QString TextToHex(const QString& text)
-{
+QString TextToHex(const QString& text) {
     return QString::fromLatin1(AnsiCodePage::encode(text).toHex().toUpper());
 }
 
-QString HexToChars(const QString& hex)
-{
+QString HexToChars(const QString& hex) {
     QByteArray bytes;
     for (qsizetype i = 0; i < hex.size(); i += 2)
         bytes.append(static_cast<char>(HexToDecimal(hex.mid(i, 2)).toInt()));
     return AnsiCodePage::decode(bytes);
 }
 
-QString HexToDecimal(const QString& hex)
-{
+QString HexToDecimal(const QString& hex) {
     QString digits = hex.trimmed().toUpper();
     if (digits.startsWith(QLatin1String("&H")))
         digits.remove(0, 2);
-    bool ok = false;
-    const auto number = digits.toULongLong(&ok, 16);
-    if (!ok || digits.size() > 8 || digits.startsWith(u'+'))
+    // The library's reader would take a sign and "0X" too.
+    const bool hexadecimal = std::all_of(digits.begin(), digits.end(),
+                                         [](QChar c) { return (c >= u'0' && c <= u'9') || (c >= u'A' && c <= u'F'); });
+    if (!hexadecimal || digits.isEmpty() || digits.size() > 8)
         return QStringLiteral("00");
+    const auto number = digits.toULongLong(nullptr, 16);
     if (number <= 0xFFFF && digits.size() <= 4)
         return QString::number(static_cast<std::int16_t>(number));
     return QString::number(static_cast<std::int32_t>(number));

@@ -2,31 +2,29 @@
 
 #include "common/AnsiCodePage.h"
 
+#include <utility>
+
 namespace lumora {
 
-void ListOutput::separate()
-{
+void ListOutput::separate() {
     if (!m_atLineStart)
         m_bytes.append(',');
     m_atLineStart = false;
 }
 
-ListOutput& ListOutput::text(const QString& value)
-{
+ListOutput& ListOutput::text(const QString& value) {
     separate();
     m_bytes.append('"').append(AnsiCodePage::encode(value)).append('"');
     return *this;
 }
 
-ListOutput& ListOutput::number(long long value)
-{
+ListOutput& ListOutput::number(long long value) {
     separate();
     m_bytes.append(QByteArray::number(value));
     return *this;
 }
 
-ListOutput& ListOutput::date(const std::optional<QDateTime>& value)
-{
+ListOutput& ListOutput::date(const std::optional<QDateTime>& value) {
     separate();
     const QDateTime when = value.value_or(QDateTime(QDate(1899, 12, 30), QTime(0, 0)));
     const bool midnight = when.time().msecsSinceStartOfDay() < 1000;
@@ -40,8 +38,7 @@ ListOutput& ListOutput::date(const std::optional<QDateTime>& value)
     return *this;
 }
 
-ListOutput& ListOutput::endLine()
-{
+ListOutput& ListOutput::endLine() {
     m_bytes.append("\r\n");
     m_atLineStart = true;
     return *this;
@@ -49,45 +46,62 @@ ListOutput& ListOutput::endLine()
 
 namespace {
 
-// An item that was opened by a quote is closed by a quote before a comma or a line end. A line whose last item is still open
-// goes on behind the break: the customer's note may hold one.
-bool lastItemIsOpen(const QString& line)
-{
-    if (!line.contains(u'"'))
-        return false;
-    const qsizetype valueStart = line.startsWith(u'"') ? line.indexOf(QLatin1String("\",")) : -1;
-    const QString last = valueStart < 0 ? line : line.mid(valueStart + 2);
-    return last.startsWith(u'"') && (last.size() < 2 || !last.endsWith(u'"'));
-}
+// The line that is being read. An item that was opened by a quote is closed by a quote before a line end; a line whose
+// last item is still open goes on behind the break: the customer's note may hold one. Each part is looked at once, so
+// that a long text with a quote that never closes takes no longer than another.
+class GrowingLine {
+public:
+    void append(const QString& part) {
+        if (m_open)
+            m_text += u'\n';
+        const qsizetype from = m_text.size();
+        m_text += part;
+        if (m_valueAt < 0 && m_text.startsWith(u'"')) {
+            const qsizetype keyEnd = m_text.indexOf(QLatin1String("\","), from);
+            m_valueAt = keyEnd < 0 ? -1 : keyEnd + 2;
+        }
+        const QStringView last = QStringView(m_text).mid(m_valueAt < 0 ? 0 : m_valueAt);
+        m_open = last.startsWith(u'"') && (last.size() < 2 || !last.endsWith(u'"'));
+    }
+
+    bool open() const { return m_open; }
+
+    QString take() {
+        m_open = false;
+        m_valueAt = -1;
+        return std::exchange(m_text, QString());
+    }
+
+private:
+    QString m_text;
+    qsizetype m_valueAt = -1; // where the item behind the key begins
+    bool m_open = false;
+};
 
 } // namespace
 
-QStringList ListOutputLines(const QByteArray& bytes)
-{
+QStringList ListOutputLines(const QByteArray& bytes) {
     const QString all = AnsiCodePage::decode(bytes);
     QStringList lines;
-    QString line;
-    bool open = false;
+    GrowingLine line;
     const auto physical = all.split(u'\n');
     for (qsizetype i = 0; i < physical.size(); ++i) {
         const bool terminated = i + 1 < physical.size();
         QString part = physical[i];
         if (part.endsWith(u'\r'))
             part.chop(1);
-        if (!terminated && part.isEmpty() && !open)
+        if (!terminated && part.isEmpty())
             break;
-        line = open ? line + u'\n' + part : part;
-        open = lastItemIsOpen(line);
-        if (!open)
-            lines += line;
+        line.append(part);
+        if (!line.open())
+            lines += line.take();
     }
-    if (open)
-        lines += line;
+    if (line.open())
+        lines += line.take();
     return lines;
 }
 
-QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes)
-{
+QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes) {
     QList<ListOutputEntry> entries;
     for (const QString& line : ListOutputLines(bytes)) {
         const qsizetype keyEnd = line.indexOf(QLatin1String("\","));
@@ -100,8 +114,7 @@ QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes)
     return entries;
 }
 
-QString WithoutEnds(const QString& line)
-{
+QString WithoutEnds(const QString& line) {
     return line.size() < 2 ? QString() : line.sliced(1, line.size() - 2);
 }
 
