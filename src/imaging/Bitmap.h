@@ -12,9 +12,7 @@ class Bitmap {
 public:
     Bitmap() = default;
     explicit Bitmap(QImage image)
-        : m_image(std::move(image))
-    {
-    }
+        : m_image(std::move(image)) {}
     // Filled with the colour. Null when width or height is under 1 or memory is short.
     Bitmap(int width, int height, QColor fill);
 

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "common/Result.h"
+#include "imaging/Bitmap.h"
+#include "imaging/PictureFile.h"
+#include "imaging/PictureInput.h"
+
+#include <memory>
+
+namespace lumora {
+
+// One JPEG file on its way in. libjpeg's own way with an error is to end the process; here it is a failure, and so is a
+// warning that data is missing or can't be true.
+class JpegReader {
+public:
+    // Reads the header.
+    static Result<std::unique_ptr<JpegReader>> open(PictureInput input);
+    ~JpegReader();
+    JpegReader(const JpegReader&) = delete;
+    JpegReader& operator=(const JpegReader&) = delete;
+
+    PictureSize size() const;
+
+    // The whole picture in colour; the reader is used up. denominator 1, 2, 4 or 8 asks for the picture shrunk by it,
+    // each side rounded up.
+    Result<Bitmap> readBitmap(int denominator = 1);
+
+private:
+    struct State;
+    explicit JpegReader(std::unique_ptr<State> state);
+
+    std::unique_ptr<State> m_state;
+};
+
+} // namespace lumora

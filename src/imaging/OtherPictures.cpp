@@ -1,0 +1,93 @@
+#include "imaging/OtherPictures.h"
+
+#include "common/WholeFile.h"
+
+#include <QBuffer>
+#include <QImageReader>
+#include <QtEndian>
+
+#include <cerrno>
+#include <mutex>
+
+namespace lumora {
+
+namespace {
+
+Result<QByteArray> readAll(const PictureInput& input) {
+    QByteArray bytes(input.size(), Qt::Uninitialized);
+    qsizetype filled = 0;
+    while (filled < bytes.size()) {
+        const std::ptrdiff_t got = input.read(bytes.data() + filled, static_cast<std::size_t>(bytes.size() - filled));
+        if (got < 0)
+            return fileFailure(input.path(), QStringLiteral("can't be read"), errno);
+        if (got == 0)
+            break;
+        filled += got;
+    }
+    bytes.truncate(filled);
+    return bytes;
+}
+
+// The reader takes a BMP that breaks off for a whole one and leaves the rest black.
+bool isCutShortBmp(const QByteArray& bytes) {
+    constexpr qsizetype headers = 14 + 40;
+    if (bytes.size() < headers)
+        return true;
+    const auto* data = reinterpret_cast<const uchar*>(bytes.constData());
+    const auto compression = qFromLittleEndian<quint32>(data + 30);
+    if (compression == 1 || compression == 2) // run lengths: the size says nothing
+        return false;
+    const qint64 offset = qFromLittleEndian<quint32>(data + 10);
+    const qint64 width = qFromLittleEndian<qint32>(data + 18);
+    const qint64 height = qAbs(static_cast<qint64>(qFromLittleEndian<qint32>(data + 22)));
+    const qint64 bits = qFromLittleEndian<quint16>(data + 28);
+    return offset + (width * bits + 31) / 32 * 4 * height > bytes.size();
+}
+
+template <class Value, class Use>
+Result<Value> withReader(const PictureInput& input, const Use& use) {
+    // Our own bounds stand before each reading; Qt's limit of 128 MiB would refuse good pictures.
+    static std::once_flag limitLifted;
+    std::call_once(limitLifted, [] { QImageReader::setAllocationLimit(0); });
+
+    auto bytes = readAll(input);
+    if (!bytes)
+        return bytes.failure();
+    const bool bmp = input.format() == PictureInput::Format::Bmp;
+    QBuffer buffer(&*bytes);
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer, bmp ? "bmp" : "png");
+    reader.setAutoTransform(false);
+    const QSize size = reader.size();
+    if (!size.isValid())
+        return pictureFailure(input.path(), Failure::Kind::Damaged,
+                              QStringLiteral("the picture is damaged or cut short"));
+    if (auto bounds = checkPictureBounds(input.path(), size.width(), size.height()); !bounds)
+        return bounds.failure();
+    if (bmp && isCutShortBmp(*bytes))
+        return pictureFailure(input.path(), Failure::Kind::Damaged, QStringLiteral("the picture is cut short"));
+    return use(reader);
+}
+
+} // namespace
+
+Result<PictureSize> readOtherPictureSize(const PictureInput& input) {
+    return withReader<PictureSize>(input, [](QImageReader& reader) -> Result<PictureSize> {
+        return PictureSize{reader.size().width(), reader.size().height()};
+    });
+}
+
+Result<Bitmap> readOtherPicture(const PictureInput& input) {
+    return withReader<Bitmap>(input, [&input](QImageReader& reader) -> Result<Bitmap> {
+        QImage image = reader.read();
+        if (image.isNull())
+            return pictureFailure(input.path(), Failure::Kind::Damaged,
+                                  QStringLiteral("the picture is damaged or cut short"));
+        image.convertTo(image.hasAlphaChannel() ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
+        if (image.isNull())
+            return pictureFailure(input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+        return Bitmap(std::move(image));
+    });
+}
+
+} // namespace lumora

@@ -1,0 +1,146 @@
+#include "imaging/PictureFile.h"
+
+#include "common/FixedText.h"
+#include "common/WholeFile.h"
+#include "imaging/JpegReader.h"
+#include "imaging/JpegWriter.h"
+#include "imaging/OtherPictures.h"
+#include "imaging/PictureInput.h"
+
+#include <algorithm>
+#include <atomic>
+#include <functional>
+#include <optional>
+#include <thread>
+
+namespace lumora {
+
+namespace {
+
+// The strongest scaled decode that still leaves at least twice the pixels wanted: nearer than that, quality suffers.
+int decodeDenominator(PictureSize source, PictureSize wanted) {
+    int denominator = 8;
+    while (denominator > 1 &&
+           (source.width < wanted.width * 2 * denominator || source.height < wanted.height * 2 * denominator))
+        denominator /= 2;
+    return denominator;
+}
+
+Result<Bitmap> scaledFrom(PictureInput input, const std::function<PictureSize(PictureSize)>& wantedFor) {
+    const auto shrink = [](const Bitmap& whole, PictureSize wanted) {
+        return Bitmap(
+            whole.image().scaled(wanted.width, wanted.height, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
+    };
+    if (input.format() != PictureInput::Format::Jpeg) {
+        auto whole = readOtherPicture(input);
+        if (!whole)
+            return whole.failure();
+        return shrink(*whole, wantedFor({whole->width(), whole->height()}));
+    }
+    auto reader = JpegReader::open(std::move(input));
+    if (!reader)
+        return reader.failure();
+    const PictureSize wanted = wantedFor((*reader)->size());
+    auto decoded = (*reader)->readBitmap(decodeDenominator((*reader)->size(), wanted));
+    if (!decoded)
+        return decoded.failure();
+    return shrink(*decoded, wanted);
+}
+
+} // namespace
+
+Result<PictureSize> readPictureSize(const std::filesystem::path& path) {
+    auto input = PictureInput::open(path);
+    if (!input)
+        return input.failure();
+    if (input->format() != PictureInput::Format::Jpeg)
+        return readOtherPictureSize(*input);
+    auto reader = JpegReader::open(std::move(*input));
+    if (!reader)
+        return reader.failure();
+    return (*reader)->size();
+}
+
+Result<Bitmap> loadPicture(const std::filesystem::path& path) {
+    auto input = PictureInput::open(path);
+    if (!input)
+        return input.failure();
+    if (input->format() != PictureInput::Format::Jpeg)
+        return readOtherPicture(*input);
+    auto reader = JpegReader::open(std::move(*input));
+    if (!reader)
+        return reader.failure();
+    return (*reader)->readBitmap();
+}
+
+Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize size) {
+    auto input = PictureInput::open(path);
+    if (!input)
+        return input.failure();
+    if (auto bounds = checkPictureBounds(path, size.width, size.height); !bounds)
+        return bounds.failure();
+    return scaledFrom(std::move(*input), [size](PictureSize) { return size; });
+}
+
+PictureSize smallPictureSize(PictureSize picture, int cell) {
+    const double ratio = static_cast<double>(picture.width) / std::max(1, picture.height);
+    const auto other = [cell](double length) {
+        return std::clamp(static_cast<int>(RoundHalfEven(length)), 1, std::max(1, cell));
+    };
+    return ratio > 1 ? PictureSize{cell, other(cell / ratio)} : PictureSize{other(cell * ratio), cell};
+}
+
+std::vector<Result<Bitmap>> loadSmallPictures(const std::vector<std::filesystem::path>& paths, int cell) {
+    std::vector<std::optional<Result<Bitmap>>> loaded(paths.size());
+    std::atomic<std::size_t> next{0};
+    const auto work = [&] {
+        for (std::size_t i = next++; i < paths.size(); i = next++) {
+            auto input = PictureInput::open(paths[i]);
+            if (!input)
+                loaded[i].emplace(input.failure());
+            else
+                loaded[i].emplace(
+                    scaledFrom(std::move(*input), [cell](PictureSize size) { return smallPictureSize(size, cell); }));
+        }
+    };
+    {
+        const std::size_t cores = std::max(1U, std::thread::hardware_concurrency());
+        std::vector<std::jthread> helpers;
+        for (std::size_t i = 1; i < std::min(cores, paths.size()); ++i)
+            helpers.emplace_back(work);
+        work();
+    }
+    std::vector<Result<Bitmap>> results;
+    results.reserve(loaded.size());
+    for (auto& one : loaded)
+        results.push_back(std::move(*one));
+    return results;
+}
+
+Result<QByteArray> encodeJpeg(const Bitmap& picture, int quality) {
+    return writeJpeg(picture, quality);
+}
+
+Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, int quality) {
+    auto bytes = encodeJpeg(picture, quality);
+    if (!bytes)
+        return bytes.failure();
+    return writeWholeFile(path, *bytes);
+}
+
+Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality) {
+    auto scaled = loadPictureScaled(source, size);
+    if (!scaled)
+        return scaled.failure();
+    return writeJpeg(*scaled, quality);
+}
+
+Result<void> scalePictureFile(const std::filesystem::path& source, const std::filesystem::path& target,
+                              PictureSize size, int quality) {
+    auto bytes = scalePictureToJpeg(source, size, quality);
+    if (!bytes)
+        return bytes.failure();
+    return writeWholeFile(target, *bytes);
+}
+
+} // namespace lumora

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "common/Result.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <filesystem>
+
+namespace lumora {
+
+// A picture file open for reading, and what its first bytes say it is.
+class PictureInput {
+public:
+    enum class Format { Jpeg, Bmp, Png };
+
+    // The failure tells an empty file, a folder or pipe, and a file of another kind apart.
+    static Result<PictureInput> open(const std::filesystem::path& path);
+
+    PictureInput(PictureInput&& other) noexcept;
+    PictureInput& operator=(PictureInput&&) = delete;
+    ~PictureInput();
+
+    const std::filesystem::path& path() const { return m_path; }
+    Format format() const { return m_format; }
+    std::int64_t size() const { return m_size; }
+
+    // Bytes read, 0 at the end, or -1 with errno set.
+    std::ptrdiff_t read(void* target, std::size_t count) const;
+
+private:
+    PictureInput() = default;
+
+    std::filesystem::path m_path;
+    int m_file = -1;
+    std::int64_t m_size = 0;
+    Format m_format = Format::Jpeg;
+};
+
+// A failure of this picture: "PATH: reason".
+Failure pictureFailure(const std::filesystem::path& path, Failure::Kind kind, const QString& reason);
+
+// The bounds that every picture keeps, checked before memory is taken.
+Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t width, std::int64_t height);
+
+} // namespace lumora
