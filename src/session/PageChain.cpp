@@ -11,23 +11,20 @@
 
 namespace lumora {
 
-QString pageName(PageId id)
-{
+QString pageName(PageId id) {
     static constexpr std::array<const char*, 17> names = {
-        "hatchala", "nnn",   "Havharot", "kyoskNew", "tFrmNew",    "BigPics",  "RedI",      "mikledet", "gdisave",
-        "Form3",    "B3",    "Form2",    "FtpFrm",   "UploadForm", "InetForm", "MoogMeret", "SpltForm"};
+        "hatchala", "nnn", "Havharot", "kyoskNew", "tFrmNew",    "BigPics",  "RedI",      "mikledet", "gdisave",
+        "Form3",    "B3",  "Form2",    "FtpFrm",   "UploadForm", "InetForm", "MoogMeret", "SpltForm"};
     return QString::fromLatin1(names[static_cast<std::size_t>(id)]);
 }
 
 PageChain::~PageChain() = default;
 
-void PageChain::registerPage(PageId id, Maker maker)
-{
+void PageChain::registerPage(PageId id, Maker maker) {
     m_makers[id] = std::move(maker);
 }
 
-Page& PageChain::load(PageId id)
-{
+Page& PageChain::load(PageId id) {
     if (Page* existing = find(id))
         return *existing;
     assert(isRegistered(id));
@@ -39,8 +36,7 @@ Page& PageChain::load(PageId id)
     return page;
 }
 
-bool PageChain::show(PageId id)
-{
+bool PageChain::show(PageId id) {
     if (m_ended || !isRegistered(id))
         return false;
     Page* page = &load(id);
@@ -50,8 +46,7 @@ bool PageChain::show(PageId id)
     return true;
 }
 
-void PageChain::unload(PageId id)
-{
+void PageChain::unload(PageId id) {
     const auto at = m_pages.find(id);
     if (at == m_pages.end())
         return;
@@ -71,8 +66,7 @@ void PageChain::unload(PageId id)
 }
 
 // QObject::deleteLater would delete at the next pump of the very handler that is still running.
-void PageChain::deleteLeft()
-{
+void PageChain::deleteLeft() {
     if (m_left.empty())
         return;
     if (m_pump.pumping() || QThread::currentThread()->loopLevel() > 1)
@@ -81,14 +75,12 @@ void PageChain::deleteLeft()
         m_left.clear();
 }
 
-Page* PageChain::find(PageId id) const
-{
+Page* PageChain::find(PageId id) const {
     const auto at = m_pages.find(id);
     return at == m_pages.end() ? nullptr : at->second.get();
 }
 
-void PageChain::endProgram()
-{
+void PageChain::endProgram() {
     if (m_ended)
         return;
     m_ended = true;

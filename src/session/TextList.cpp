@@ -2,14 +2,12 @@
 
 namespace lumora {
 
-void TextList::clear()
-{
+void TextList::clear() {
     m_items.clear();
     m_currentIndex = -1;
 }
 
-void TextList::insert(int index, const QString& text)
-{
+void TextList::insert(int index, const QString& text) {
     if (index < 0 || index > count())
         return;
     m_items.insert(index, text);
@@ -17,8 +15,7 @@ void TextList::insert(int index, const QString& text)
         ++m_currentIndex;
 }
 
-void TextList::removeAt(int index)
-{
+void TextList::removeAt(int index) {
     if (index < 0 || index >= count())
         return;
     m_items.removeAt(index);
@@ -28,14 +25,12 @@ void TextList::removeAt(int index)
         --m_currentIndex;
 }
 
-void TextList::replaceAt(int index, const QString& text)
-{
+void TextList::replaceAt(int index, const QString& text) {
     removeAt(index);
     insert(index, text);
 }
 
-void TextList::setCurrentIndex(int index)
-{
+void TextList::setCurrentIndex(int index) {
     m_currentIndex = index >= 0 && index < count() ? index : -1;
 }
 

@@ -2,14 +2,12 @@
 
 namespace lumora {
 
-Ticker::Ticker(int milliseconds, std::function<void()> tick)
-{
+Ticker::Ticker(int milliseconds, std::function<void()> tick) {
     m_timer.setInterval(milliseconds);
     QObject::connect(&m_timer, &QTimer::timeout, std::move(tick));
 }
 
-void Ticker::start()
-{
+void Ticker::start() {
     if (!m_timer.isActive())
         m_timer.start();
 }
