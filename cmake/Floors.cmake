@@ -4,7 +4,7 @@
 
 add_library(lumora_options INTERFACE)
 target_compile_options(lumora_options INTERFACE
-  -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wnull-dereference
+  -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual
   -Wimplicit-fallthrough -Werror)
 target_compile_definitions(lumora_options INTERFACE
   QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_NO_KEYWORDS LUMORA_VERSION="${PROJECT_VERSION}")
