@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "session/Caption.h"
 #include "session/Page.h"
@@ -47,7 +48,8 @@ public:
     Caption Label5;         // copies in all
     Caption Label17;        // position of the picture in work, from 1; empty before the first
     Caption Label16;        // how many pictures there are
-    Caption Label4Progress; // a sentence: what is happening, with position, count and file name
+    Caption Label4Progress; // a sentence: what is happening, with position and count
+    Caption Label4Picture;  // file name of the picture in work
     Caption Label4fail;     // a sentence: how many could not be prepared; empty when all could
     Caption Label4removed;  // a sentence above List4removed; empty when nothing was dropped
     Caption Label6;         // the warning not to delete the pictures yet, two lines
@@ -62,27 +64,30 @@ public:
     bool preparing = false;
 
 private:
-    class Preparation;
+    enum class Stage { Waiting, Checking, Sheet, Pictures, Closing, Done };
+    class Steps;
 
-    void takeHandOver();
     void KeepOnlyJpeg();
     void CountTotalPics();
     void setPreparing(bool on);
-    void setProgress(const QString& text);
-    void drawSheet();
+    void setStage(Stage stage, int position = 0);
+    void showProgress();
+    bool drawSheet(bool album);
     bool prepareOrder();
-    void PackOnePicture(int index, Preparation& preparation);
+    void PackOnePicture(int index, Steps& steps);
     void addFailed(const QString& path);
+    void tellWriteFailure(const Failure& failure);
+    void tell(const QString& hebrew, const QString& english, const QString& reason);
     void handOver();
-    void yield();
-    bool left() const;
+    bool yield();
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
-    QString m_sheetPath;
-    QString m_manifestLine; // what the step in work would tell a manifest: length, code, running number, name
+    Stage m_stage = Stage::Waiting;
+    QString m_manifestLine; // what a manifest would tell of the step in work: length, code, running number, name
     int m_runningNumber = 1;
+    int m_writeFailures = 0;
     bool m_handedOver = false;
     std::optional<QPoint> m_dragFrom;
 };

@@ -1,0 +1,208 @@
+#include "assembly/OrderSheet.h"
+
+#include "assembly/WorkAhead.h"
+#include "common/FixedText.h"
+#include "session/SessionState.h"
+
+#include <QFont>
+#include <QFontMetrics>
+#include <QPainter>
+#include <QTransform>
+
+#include <algorithm>
+#include <array>
+
+namespace lumora {
+namespace {
+
+struct SizeStep {
+    int upTo;
+    PictureSize edited;
+    PictureSize plain;
+};
+
+constexpr std::array<SizeStep, 5> sizeSteps = {{
+    {10, {450, 580}, {500, 480}},
+    {50, {450, 880}, {500, 880}},
+    {70, {660, 880}, {660, 880}},
+    {100, {750, 1000}, {750, 1000}},
+    {200, {900, 1000}, {900, 1000}},
+}};
+constexpr PictureSize largestSheet = {1100, 1300};
+
+const QString mixedSizes = QStringLiteral("zz/zz");
+
+// Pixels of a 96 dpi screen: 12 and 8 points.
+constexpr int lineFontPixels = 16;
+constexpr int captionFontPixels = 11;
+constexpr QPoint textStart(10, 10);
+
+QFont sheetFont(int pixels) {
+    QFont font;
+    font.setPixelSize(pixels);
+    return font;
+}
+
+// The lines run as the box's text output has it: from the left, the words of a Hebrew phrase in their own order.
+void drawTextLine(QPainter& painter, int x, int top, const QString& text) {
+    painter.setLayoutDirection(Qt::LeftToRight);
+    painter.drawText(QPoint(x, top + painter.fontMetrics().ascent()), text);
+}
+
+// Where the prints are fetched, by the way in which the order came. The places are those of the lab's branches.
+QString plainDeliveryLine(const QString& kodMishloach) {
+    struct Place {
+        const char16_t* code;
+        const char16_t* place;
+    };
+    static constexpr std::array<Place, 3> places = {{
+        {u"KIN", u"קבלת תמונות בקניון"},
+        {u"LOB", u"קבלת תמונות בלובי"},
+        {u"NSM", u"קבלת תמונות בסניף"},
+    }};
+    for (const Place& place : places) {
+        if (kodMishloach.left(3) == QString::fromUtf16(place.code))
+            return QString::fromUtf16(place.place);
+    }
+    return {};
+}
+
+QString topLine(const SessionState& state, const QDateTime& now) {
+    return QStringLiteral("No.....") + state.MisparHazmana + u'_' + state.shemot.ser + QStringLiteral("    ") +
+           now.toString(QStringLiteral("dd/MM/yyyy HH:mm:ss")) + QStringLiteral("     ") +
+           plainDeliveryLine(state.KodMishloach) + QStringLiteral(" ver: ") + state.shemot.Girsa;
+}
+
+} // namespace
+
+PictureSize orderSheetSize(SheetKind kind, int items) {
+    for (const SizeStep& step : sizeSteps) {
+        if (items <= step.upTo)
+            return kind == SheetKind::Edited ? step.edited : step.plain;
+    }
+    return largestSheet;
+}
+
+QColor orderSheetBackground(SheetKind kind, const SessionState& state) {
+    if (kind != SheetKind::Edited && state.shemot.ppr == mixedSizes)
+        return {255, 192, 255};
+    return kind == SheetKind::Album ? QColor(220, 220, 150) : QColor(Qt::white);
+}
+
+QStringList plainSheetLines(const SessionState& state, const QDateTime& now) {
+    const OrderDetails& shemot = state.shemot;
+    const QString paper = shemot.ppr == mixedSizes
+                              ? shemot.ppr + QStringLiteral("   paper  Kind") + shemot.Soog2 + u' ' + shemot.Soog1
+                              : QStringLiteral("  Paper size....") + shemot.ppr + QStringLiteral("       paper  Kind") +
+                                    shemot.maat + QStringLiteral("    ") + shemot.FillFit;
+    return {
+        topLine(state, now),
+        QStringLiteral("  Name....") + shemot.n1 + QStringLiteral("        Tel.....") + shemot.n2 +
+            QStringLiteral("      ") + shemot.n4,
+        QStringLiteral("    ") + shemot.n3 + QStringLiteral("      "),
+        paper,
+        QStringLiteral("  Total pictures...") + QString::number(shemot.TotalPics) + QStringLiteral("   Border=  ") +
+            shemot.Bord + QStringLiteral("   Mail  ") + shemot.Mail,
+        shemot.Hearot,
+    };
+}
+
+QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
+    const AlbumDetails& album = state.album;
+    const QString rule(89, u'-');
+    const QString gap(7, u' ');
+    const auto& extras = album.Tosafot2;
+    return {
+        topLine(state, now),
+        QStringLiteral("  ShemZalam....") + album.ShemZalam + QStringLiteral("        TelZalam.....") + album.TelZalam +
+            QStringLiteral("      ") + state.shemot.n4,
+        // No line break behind the event: the address goes on beside it.
+        QStringLiteral("  ShemErooa....") + album.ShemErooa + QStringLiteral("    ") + state.shemot.n3 +
+            QStringLiteral("      "),
+        QStringLiteral("  MailZalam....") + album.MailZalam,
+        QStringLiteral("  Total pictures...") + QString::number(state.shemot.TotalPics),
+        rule,
+        QStringLiteral("  GodelLBM....") + album.GodelLBM + QStringLiteral("       SoogLBM....") + album.SoogLBM +
+            QStringLiteral("     SoogNiar....") + album.SoogNiar,
+        QStringLiteral("  SoogKricha....") + album.SoogKricha,
+        rule,
+        u' ' + extras[0] + gap + extras[1] + gap + extras[2] + gap + extras[3] + QStringLiteral("  "),
+        u' ' + extras[4] + gap + extras[5] + gap + extras[6] + gap + extras[7] + gap + extras[8] +
+            QStringLiteral("     "),
+        rule,
+        u' ' + album.KamutHorim + QStringLiteral("  אלבום הורים  "),
+        QStringLiteral("   סוג  אלבום  הורים  ") + album.SoogHorim + QStringLiteral("   "),
+        rule,
+        QStringLiteral("  Hearot....") + state.shemot.Hearot,
+        rule,
+    };
+}
+
+Result<Bitmap> sheetThumbnail(const std::filesystem::path& source) {
+    const Result<PictureSize> size = readPictureSize(source);
+    if (!size)
+        return size.failure();
+    const double ratio = static_cast<double>(size->height) / std::max(size->width, 1);
+    const bool turned = ratio >= 1;
+    const double across = turned ? sheetCellSize / ratio : sheetCellSize * ratio;
+    const int height = std::max(1, static_cast<int>(RoundHalfEven(across)));
+    if (!turned)
+        return loadPictureScaled(source, {sheetCellSize, height});
+    Result<Bitmap> upright = loadPictureScaled(source, {height, sheetCellSize});
+    if (!upright)
+        return upright;
+    return Bitmap(upright->image().transformed(QTransform().rotate(90)));
+}
+
+OrderSheet::OrderSheet(SheetKind kind, PictureSize size, QColor background)
+    : m_kind(kind)
+    , m_bitmap(size.width, size.height, background) {}
+
+void OrderSheet::drawLines(const QStringList& lines) {
+    QPainter painter(&m_bitmap.image());
+    painter.setFont(sheetFont(lineFontPixels));
+    painter.setPen(Qt::black);
+    int top = textStart.y();
+    for (const QString& line : lines) {
+        // A break inside a remark starts a line of its own.
+        QString text = line;
+        for (const QString& part : text.remove(u'\r').split(u'\n')) {
+            drawTextLine(painter, textStart.x(), top, part);
+            top += painter.fontMetrics().lineSpacing();
+        }
+    }
+}
+
+int OrderSheet::capacity() const {
+    const int lastRow = m_bitmap.height() / sheetCellSize - 1;
+    const int lastColumn = m_bitmap.width() / sheetCellSize - 2;
+    return lastRow * (lastColumn + 1);
+}
+
+void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after) {
+    const int columns = m_bitmap.width() / sheetCellSize - 1;
+    const int sheetTop = m_kind == SheetKind::Album ? 282 : 81;
+    const int count = std::min(capacity(), static_cast<int>(cells.size()));
+    WorkAhead<Result<Bitmap>> thumbnails(count, [&cells](int i) -> WorkAhead<Result<Bitmap>>::Work {
+        const auto source = cells[static_cast<std::size_t>(i)].source;
+        return [source]() -> Result<Bitmap> {
+            return source ? sheetThumbnail(*source) : Failure{Failure::Kind::NotFound, {}};
+        };
+    });
+    for (int i = 0; i < count; ++i) {
+        bool wanted = true;
+        const Result<Bitmap> picture = thumbnails.take([&] { wanted = wanted && after(i); });
+        if (wanted && picture) {
+            const QPoint at((sheetCellSize + 2) * (i % columns) + 5, sheetCellSize * (1 + i / columns) + sheetTop);
+            QPainter painter(&m_bitmap.image());
+            painter.drawImage(at, picture->image());
+            painter.setFont(sheetFont(captionFontPixels));
+            painter.setPen(Qt::black);
+            drawTextLine(painter, at.x(), at.y() + picture->height(), cells[static_cast<std::size_t>(i)].caption);
+        }
+        if (!wanted || !after(i))
+            return;
+    }
+}
+
+} // namespace lumora

@@ -1,0 +1,66 @@
+#pragma once
+
+#include "common/Result.h"
+#include "imaging/Bitmap.h"
+#include "imaging/PictureFile.h"
+
+#include <QDateTime>
+#include <QStringList>
+
+#include <filesystem>
+#include <functional>
+#include <optional>
+#include <vector>
+
+// The order sheet: the order's details as lines of text on top of a contact sheet of its pictures, for the people at
+// the lab.
+namespace lumora {
+
+struct SessionState;
+
+// What the two preparation pages draw differently.
+enum class SheetKind { Plain, Edited, Album };
+
+// The box grows with the number of pictures.
+PictureSize orderSheetSize(SheetKind kind, int items);
+
+QColor orderSheetBackground(SheetKind kind, const SessionState& state);
+
+// The lines of text from the top, blanks included. The edited order's lines are not among them yet.
+QStringList plainSheetLines(const SessionState& state, const QDateTime& now);
+QStringList albumSheetLines(const SessionState& state, const QDateTime& now);
+
+// A picture of the contact sheet and the text below it. A cell without a source stays empty.
+struct SheetCell {
+    std::optional<std::filesystem::path> source;
+    QString caption;
+};
+
+inline constexpr int sheetCellSize = 80;
+
+// A picture as it lies on the sheet, always in landscape: 80 pixels wide, a portrait or square one turned a quarter
+// clockwise.
+Result<Bitmap> sheetThumbnail(const std::filesystem::path& source);
+
+class OrderSheet {
+public:
+    OrderSheet(SheetKind kind, PictureSize size, QColor background);
+
+    void drawLines(const QStringList& lines);
+
+    // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, cells beyond them left out and
+    // what falls below the box clipped. Pictures are read on the machine's cores. after(i) runs on the calling thread
+    // behind each cell and whenever it waits; when it answers false the drawing ends there.
+    void drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after);
+
+    // How many cells the grid holds.
+    int capacity() const;
+
+    const Bitmap& bitmap() const { return m_bitmap; }
+
+private:
+    SheetKind m_kind;
+    Bitmap m_bitmap;
+};
+
+} // namespace lumora
