@@ -10,9 +10,9 @@
 namespace lumora {
 
 class PageChain;
-class UploadRoom;
 struct Platform;
 struct SessionState;
+struct UploadRoom;
 
 // The sending page: takes one finished order folder and gets all of its files onto the lab's server. It lists them,
 // counts down, sends each on a connection of its own, then looks at what arrived and goes round again for what did not,
@@ -81,11 +81,56 @@ public:
 
     // The signal is Page::changed().
 
+    // Takes one chain order by its folder name and sends it.
+    void SendChainOrder(const QString& name);
+    // Makes a resend of a folder from File1 itself, as the finished-orders page does. No caller.
+    void PrepareResendHere(const QString& folder);
+    // The routine with the yes/no box that the makers meant for a fatal error. No caller.
+    void AskAfterFatalError();
+
 private:
+    enum class Phase { NoOrder, Countdown, Waiting, Sending, Checking, Success, NotAll, Stopped, Silent };
+
+    // FtpFrm.cpp
+    void setButtonTexts();
+    void setPanelTexts();
+    void showWhatToDo();
+    void enter(Phase phase);
+    void leaveProgram();
+    void stopTimers();
+    void addProofPicture();
+
+    // FtpFrmOrder.cpp
+    bool settingsFound();
+    void beginList();
+    void listFolder();
+    bool orderIsChosen() const;
+    void CountOrderPictures();
+    void ShowOrderSummary();
+    void armCountdown();
+
+    // FtpFrmAttempts.cpp
+    Phase RunAttempts();
+    bool checkAttempt(int attempt);
+    void showNotAll();
+    void showFailure();
+    void SendSuccess();
+    void finish(Phase phase);
+
+    // FtpFrmHidden.cpp
+    bool inSession(const QString& message);
+    QString chosenRemoteName();
+
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     std::unique_ptr<UploadRoom> m_room; // the rules at work
+    QStringList m_handedOver;           // the lines that the finished-orders page gave
+    Phase m_phase = Phase::NoOrder;
+    bool m_activated = false;
+    // Asked for by Command26, set by no page.
+    bool m_proofWanted = false;
+    QString m_proofText;
 };
 
 } // namespace lumora

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+namespace lumora {
+
+class Files;
+class TextList;
+struct Platform;
+
+// kashloo.txt in the local order folder: the files whose put failed, one full local path a line. It outlives the
+// program, so that what a broken put left on the server is not taken for a sent file when the order is sent again. A
+// write that fails is told.
+QString BrokenFilesPath(const QString& orderFolder);
+void WriteBrokenFiles(const Platform& platform, const QString& orderFolder, const TextList& broken);
+// Empty when there is no such file.
+QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder);
+
+// True if one of the paths has this leaf name.
+bool IsBroken(const TextList& broken, const QString& leafName);
+
+} // namespace lumora

@@ -1,0 +1,48 @@
+#pragma once
+
+#include "session/Caption.h"
+#include "session/Page.h"
+
+namespace lumora {
+
+class PageChain;
+struct Platform;
+struct SessionState;
+
+// A page that nobody sees: its buttons tell the lab's web site that an order has arrived. The answers are stored and
+// read by nobody, and a report that is lost changes nothing: the order is on the server already.
+class InetForm : public Page {
+    Q_OBJECT
+public:
+    InetForm(SessionState& state, const Platform& platform, PageChain& chain);
+
+    // Events.
+    void Command1_Click();   // the order report
+    void Command2_Click();   // the done call
+    void Command4_Click() {} // "pricelist"
+    void cmdLoad_Click() {}  // "Load"
+
+    // State.
+    QString TeshuvatSharat; // answer of the last call
+
+    // The body behind a URL, past every cache; empty when there is none. Without a line a box tells so.
+    QString FetchUrlSmall(const QString& url);
+
+private:
+    SessionState& m_state;
+    const Platform& m_platform;
+};
+
+// Fetches a URL to a file under a drive path. True unless the path names no place on this machine: the download's own
+// result is not examined.
+class clsDownload {
+public:
+    explicit clsDownload(const Platform& platform)
+        : m_platform(platform) {}
+    bool download(const QString& url, const QString& path) const;
+
+private:
+    const Platform& m_platform;
+};
+
+} // namespace lumora

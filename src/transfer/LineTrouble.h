@@ -1,0 +1,21 @@
+#pragma once
+
+#include "common/Result.h"
+
+#include <QString>
+
+namespace lumora {
+
+struct SessionState;
+
+// Which step of the transfer failed.
+enum class LineStep { Open, Connect, OrderFolder, Put, List };
+
+// What a failure of the line means for the customer, in the language of the session. subject is the file's name where a
+// file is concerned.
+QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject = {});
+
+// The number under which the makers know a failure of the line; 12003 stands for an answer of the server itself.
+int LineErrorNumber(Failure::Kind kind);
+
+} // namespace lumora

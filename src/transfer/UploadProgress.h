@@ -1,0 +1,27 @@
+#pragma once
+
+#include <QString>
+
+#include <optional>
+
+namespace lumora {
+
+// How far a pass over count files is when the file at index begins: Int(index / max(count - 1, 1) * 100).
+int UploadPercent(int index, int count);
+
+// Width of the inner bar: Int(percent * full / 100).
+int BarWidth(int percent, int full);
+
+// The place of a piece in its order, from the last 11 characters of its name: sequence, "_", total, ".prk".
+struct PieceOfOrder {
+    QString sequence;
+    QString total;
+    double share() const; // 0 to 1; a total below 1 counts as 1
+    bool last() const { return sequence == total; }
+};
+std::optional<PieceOfOrder> PieceFromName(const QString& name);
+
+// Minutes left, from the seconds that the last piece took: truncated, plus 3 for the check that follows.
+int MinutesLeft(qint64 secondsOfOne, int remaining);
+
+} // namespace lumora
