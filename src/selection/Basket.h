@@ -1,0 +1,59 @@
+#pragma once
+
+#include "selection/PrintCode.h"
+#include "session/TextList.h"
+
+#include <QHash>
+
+namespace lumora {
+
+// The basket: lines in the order of first choice, a replaced line stays in its place. A picture stands in it once,
+// found by its path. Finding is as fast with thousands of lines as with ten, since twelve are looked for at each page
+// change.
+class Basket {
+public:
+    // The form of all lines; given once, while the basket is empty.
+    void setForm(LineForm form) { m_form = form; }
+    LineForm form() const { return m_form; }
+
+    const TextList& lines() const { return m_lines; }
+    int count() const { return m_lines.count(); }
+    bool isEmpty() const { return m_lines.isEmpty(); }
+    QString item(int index) const { return m_lines.item(index); }
+    // The reading position of the pages of chosen pictures.
+    int currentIndex() const { return m_lines.currentIndex(); }
+    void setCurrentIndex(int index) { m_lines.setCurrentIndex(index); }
+
+    // The first line equal to the text, else -1.
+    int FindExact(const QString& line) const { return m_lines.find(line); }
+    // The first line whose text from column 10 on is the path. A line of under 12 characters ends the search: it can
+    // only be part of a corrupted list.
+    int FindByPath9(const QString& path) const;
+    // The same in the basket's own form: from column 10 on, or from column 210 on.
+    int FindByPath(const QString& path) const;
+
+    void clear();
+    void append(const QString& line);
+    void replaceAt(int index, const QString& line);
+    void removeAt(int index);
+
+    // The copies of all lines. They are summed wide and held at what a 16-bit field takes.
+    int SumCopies() const;
+
+    // Drops each line that equals an earlier one but for its copies, so that the copies counted first stand.
+    void removeDuplicates();
+
+private:
+    QString pathOf(const QString& line) const;
+    void indexAll() const;
+    void forget();
+
+    LineForm m_form = LineForm::Short;
+    TextList m_lines;
+    long long m_copies = 0;
+    mutable QHash<QString, int> m_byPath; // the first line of each path
+    mutable bool m_indexed = true;
+    mutable bool m_indexClosed = false; // a line that is too short stands before what follows
+};
+
+} // namespace lumora

@@ -1,0 +1,16 @@
+#pragma once
+
+#include <QString>
+
+namespace lumora {
+
+// A coupon order must match the coupon's quantity exactly, copies included.
+enum class CouponFit { Matches, TooMany, TooFew };
+CouponFit checkCoupon(int couponPictures, int total);
+
+// Deep compression of large prints, whose longer side is 45 or more.
+enum class DeepCompression { Off, On, Ask };
+// policy: 1 ask, 2 always; any other never. A paper without a size counts as 15.
+DeepCompression deepCompression(const QString& ppr, int policy);
+
+} // namespace lumora

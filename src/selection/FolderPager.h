@@ -1,0 +1,48 @@
+#pragma once
+
+#include "session/TextList.h"
+
+#include <QSet>
+
+#include <functional>
+
+namespace lumora {
+
+// How many small pictures a page has.
+inline constexpr int cellsOfPage = 12;
+
+// Walks a list from its current index: up to twelve texts, those that read gives as empty left out. Behind a full page
+// the index stands on the first item of the next page; at the end of the list it stays on the last item, so that a
+// further page shows that one alone.
+QStringList FillPage(const QStringList& items, int& currentIndex, const std::function<QString(const QString&)>& read);
+
+// All paths of the folders picked so far; its current index is the reading position of the paging.
+class FolderPager {
+public:
+    const TextList& paths() const { return m_paths; }
+    int count() const { return m_paths.count(); }
+    bool isEmpty() const { return m_paths.isEmpty(); }
+    QString item(int index) const { return m_paths.item(index); }
+    int currentIndex() const { return m_paths.currentIndex(); }
+
+    void clear();
+
+    // Adds the files of a folder. A file is left out when folder and name joined as they stand are in the list already,
+    // which can only be for a drive root, since its path alone ends in a backslash: an ordinary folder that is picked
+    // twice stands twice. When the list grew, the reading position becomes the last of the old items, or the first
+    // picture. Returns how many were added.
+    int addFolder(const QString& folder, const QStringList& names);
+
+    bool IsInFolderList(const QString& path) const { return m_known.contains(path); }
+
+    // The next page.
+    QStringList FillPageList();
+    // The page in view and the one before it are 24 items; below that the first page follows.
+    void PageBack();
+
+private:
+    TextList m_paths;
+    QSet<QString> m_known; // beside the list, so that adding a folder of thousands stays instant
+};
+
+} // namespace lumora

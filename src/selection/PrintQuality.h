@@ -1,0 +1,29 @@
+#pragma once
+
+#include "imaging/PictureFile.h"
+
+#include <QString>
+
+namespace lumora {
+
+// How well a picture of so many pixels prints. It is advice and blocks nothing; neither the paper nor an edit plays a
+// part.
+enum class PrintGrade {
+    Good,       // above 800000 pixels
+    Unmarked,   // exactly 800000: the text of the picture before stays
+    Borderline, // below 800000
+    VeryLow,    // below 400000
+};
+
+PrintGrade printGrade(PictureSize size);
+
+// The grade in words, height before width. Empty for Unmarked.
+QString printGradeText(PrintGrade grade, PictureSize size, bool english);
+
+// The large view in logical units: 300 wide for an upright or square picture, else 400; the height follows.
+PictureSize largeViewSize(PictureSize picture);
+
+// A small picture in its cell: the longer side fills it. At least one pixel a side.
+PictureSize smallPictureSize(PictureSize picture, int cell);
+
+} // namespace lumora
