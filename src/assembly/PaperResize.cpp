@@ -1,13 +1,14 @@
 #include "assembly/PaperResize.h"
 
 #include "common/FixedText.h"
+#include "platform/HostPath.h"
 
 #include <algorithm>
 
 namespace lumora {
 
 std::optional<PaperSize> PaperSize::parse(const QString& text) {
-    const PaperSize paper{static_cast<int>(Val(text.left(2))), static_cast<int>(Val(text.right(2)))};
+    const PaperSize paper{Val16(text.left(2)), Val16(text.right(2))};
     if (paper.shortSide <= 0 || paper.longSide <= 0)
         return std::nullopt;
     return paper;
@@ -16,10 +17,12 @@ std::optional<PaperSize> PaperSize::parse(const QString& text) {
 PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
     const double ratio = static_cast<double>(source.height) / std::max(source.width, 1);
     const int width = (ratio >= 1 ? paper.shortSide : paper.longSide) * pixelsPerCentimetre;
-    const double height = static_cast<double>(RoundHalfEven(width * ratio));
-    if (width > source.width || height > source.height)
+    // The product first: it is exact, so that a height of one half is seen as one.
+    const double height = static_cast<double>(width) * source.height / std::max(source.width, 1);
+    const long long rounded = RoundHalfEven(height);
+    if (width > source.width || rounded > source.height)
         return source;
-    return {width, static_cast<int>(height)};
+    return {width, static_cast<int>(rounded)};
 }
 
 Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper) {
@@ -30,7 +33,7 @@ Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize 
     if (target.width < 1 || target.height < 1)
         return Failure{Failure::Kind::Damaged,
                        QStringLiteral("%1: nothing is left of a picture of %2 x %3 on this paper")
-                           .arg(QString::fromStdU16String(source.u16string()))
+                           .arg(toText(source))
                            .arg(size->width)
                            .arg(size->height)};
     return scalePictureToJpeg(source, target, printQuality);
