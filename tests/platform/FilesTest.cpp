@@ -1,0 +1,167 @@
+#include "platform/Files.h"
+#include "support/SmallDisk.h"
+
+#include <QTemporaryDir>
+
+#include <sys/stat.h>
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+class FilesTest : public ::testing::Test {
+    QTemporaryDir m_folder;
+
+protected:
+    HostPath data = toHostPath(m_folder.path());
+    Drives drives{data, u'C', {}};
+    Files files{drives};
+
+    void put(const HostPath& name, const std::string& content = "x") const {
+        fs::create_directories((data / name).parent_path());
+        std::ofstream(data / name, std::ios::binary) << content;
+    }
+    // What is left in a folder besides its named files, hidden ones included.
+    static int countAll(const HostPath& folder) {
+        return static_cast<int>(std::distance(fs::directory_iterator(folder), fs::directory_iterator()));
+    }
+};
+
+TEST_F(FilesTest, ListsByPatternWithoutCaseAndSortsWithoutCase) {
+    for (const char* name :
+         {"b.JPG", "A.jpg", "10.Jpg", "!7.jpp", "a.jpp", ".hidden.jpg", "noending", "ת.jpg", "c.jpeg", "_u.jpg"})
+        put(name);
+    fs::create_directory(data / "folder.jpg");
+    fs::create_symlink("nowhere", data / "broken.jpg");
+    const std::pair<const char*, const char*> cases[] = {
+        {"*.jpg", "10.Jpg|_u.jpg|A.jpg|b.JPG|ת.jpg"},
+        {"*.JPP;*.jpeg", "!7.jpp|a.jpp|c.jpeg"},
+        {" *.jpp ; *.gbr", "!7.jpp|a.jpp"},
+        {"?.jpg", "A.jpg|b.JPG|ת.jpg"},
+        {"*.*", "!7.jpp|10.Jpg|_u.jpg|A.jpg|a.jpp|b.JPG|c.jpeg|noending|ת.jpg"},
+        {"*", "!7.jpp|10.Jpg|_u.jpg|A.jpg|a.jpp|b.JPG|c.jpeg|noending|ת.jpg"},
+        {"a*j*p*", "A.jpg|a.jpp"},
+        {"", ""},
+    };
+    for (const auto& [pattern, expected] : cases)
+        EXPECT_EQ(files.names(QStringLiteral("C:\\"), QString::fromLatin1(pattern)).join(u'|').toStdString(), expected)
+            << pattern;
+    EXPECT_EQ(files.folders(QStringLiteral("C:\\")), QStringList(QStringLiteral("folder.jpg")));
+    EXPECT_TRUE(files.names(QStringLiteral("C:\\missing"), QStringLiteral("*")).isEmpty());
+}
+
+TEST_F(FilesTest, ShowsAQuestionMarkForWhatTheCodePageLacksAndTakesItForAbsent) {
+    put("漢.jpg");
+    put("\xff.jpg");
+    EXPECT_EQ(files.names(QStringLiteral("C:\\"), QStringLiteral("*.jpg")),
+              QStringList({QStringLiteral("?.jpg"), QStringLiteral("?.jpg")}));
+    put("real?.jpg");
+    EXPECT_FALSE(files.fileExists(QStringLiteral("C:\\real?.jpg")));
+    EXPECT_EQ(files.read(QStringLiteral("C:\\real?.jpg")).failure().kind, Failure::Kind::NotFound);
+    EXPECT_FALSE(files.writeWhole(QStringLiteral("C:\\new?.jpg"), "x"));
+}
+
+TEST_F(FilesTest, CollectsThroughSubfoldersAndEndsWhereALinkLeadsBack) {
+    put("a/1.jpg");
+    put("a/b/2.jpg");
+    fs::create_directory_symlink(data, data / "a" / "b" / "loop");
+    EXPECT_EQ(files.collect(QStringLiteral("C:\\a\\"), Files::Depth::WithSubfolders).join(u'|'),
+              QStringLiteral("C:\\a\\1.jpg|C:\\a\\b\\2.jpg"));
+    EXPECT_EQ(files.collect(QStringLiteral("C:\\a"), Files::Depth::ThisFolder).join(u'|'),
+              QStringLiteral("C:\\a\\1.jpg"));
+}
+
+TEST_F(FilesTest, WritesReadsCopiesAndRemoves) {
+    const QByteArray bytes("\r\n\0\xff mixed\n", 11);
+    const QString path = QStringLiteral("C:\\שם.txt");
+    ASSERT_TRUE(files.writeWhole(path, "old"));
+    ASSERT_TRUE(files.writeWhole(path, bytes));
+    EXPECT_EQ(files.read(path).value(), bytes);
+    EXPECT_EQ(files.size(path).value(), bytes.size());
+    ASSERT_TRUE(files.copyFile(path, QStringLiteral("C:\\copy.txt")));
+    EXPECT_EQ(files.read(QStringLiteral("C:\\copy.txt")).value(), bytes);
+    ASSERT_TRUE(files.removeFile(path));
+    EXPECT_FALSE(files.fileExists(path));
+    EXPECT_EQ(countAll(data), 1);
+}
+
+TEST_F(FilesTest, MakesFoldersForTheirOwnerOnly) {
+    ASSERT_TRUE(files.makeFolder(QStringLiteral("C:\\2000lumora")));
+    ASSERT_TRUE(files.makeFolder(QStringLiteral("C:\\2000lumora"))); // again
+    struct stat status {};
+    ASSERT_EQ(::stat((data / "2000lumora").c_str(), &status), 0);
+    EXPECT_EQ(status.st_mode & 0777, 0700U);
+    EXPECT_EQ(files.makeFolder(QStringLiteral("C:\\no\\parent")).failure().kind, Failure::Kind::NotFound);
+    put("afile");
+    EXPECT_FALSE(files.makeFolder(QStringLiteral("C:\\afile")));
+}
+
+TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
+    const QString path = QStringLiteral("C:\\") + QString(200, QChar(0x05D0)) + QStringLiteral(".jpg");
+    ASSERT_TRUE(files.writeWhole(path, "view"));
+    EXPECT_TRUE(files.fileExists(path));
+    EXPECT_EQ(files.read(path).value(), "view");
+    const QStringList listed = files.names(QStringLiteral("C:\\"), QStringLiteral("*.jpg"));
+    ASSERT_EQ(listed.size(), 1);
+    EXPECT_TRUE(files.removeFile(QStringLiteral("C:\\") + listed[0]));
+}
+
+TEST_F(FilesTest, FailsWithPathAndReason) {
+    const auto missing = files.read(QStringLiteral("C:\\no.txt"));
+    EXPECT_EQ(missing.failure().kind, Failure::Kind::NotFound);
+    EXPECT_TRUE(missing.failure().message.contains(QStringLiteral("C:\\no.txt")))
+        << missing.failure().message.toStdString();
+    fs::create_directory(data / "folder");
+    EXPECT_FALSE(files.read(QStringLiteral("C:\\folder")));
+    EXPECT_FALSE(files.writeWhole(QStringLiteral("C:\\folder"), "x"));
+    EXPECT_FALSE(files.removeFile(QStringLiteral("C:\\folder")));
+    EXPECT_FALSE(files.copyFile(QStringLiteral("C:\\no.txt"), QStringLiteral("C:\\to.txt")));
+    EXPECT_FALSE(files.fileExists(QStringLiteral("C:\\to.txt")));
+    ASSERT_EQ(::mkfifo((data / "pipe").c_str(), 0600), 0);
+    EXPECT_FALSE(files.read(QStringLiteral("C:\\pipe"))); // and does not wait for a writer
+    EXPECT_EQ(countAll(data), 2);
+}
+
+TEST(FilesOnASmallDisk, KeepsTheOldFileWhenTheDiskIsFull) {
+    SmallDisk disk(64);
+    if (!disk.available())
+        GTEST_SKIP() << "mounting takes root";
+    const Drives drives(disk.path(), u'C', {});
+    const Files files(drives);
+    const QString path = QStringLiteral("C:\\mispar.txt");
+    ASSERT_TRUE(files.writeWhole(path, "101\r\n"));
+    const auto full = files.writeWhole(path, QByteArray(200'000, 'x'));
+    ASSERT_FALSE(full);
+    EXPECT_EQ(full.failure().kind, Failure::Kind::NoSpace);
+    EXPECT_EQ(files.read(path).value(), "101\r\n");
+    EXPECT_EQ(std::distance(fs::directory_iterator(disk.path()), fs::directory_iterator()), 1);
+
+    ASSERT_TRUE(disk.makeReadOnly());
+    EXPECT_EQ(files.writeWhole(path, "102\r\n").failure().kind, Failure::Kind::AccessDenied);
+    EXPECT_EQ(files.makeFolder(QStringLiteral("C:\\new")).failure().kind, Failure::Kind::AccessDenied);
+    EXPECT_EQ(files.removeFile(path).failure().kind, Failure::Kind::AccessDenied);
+    EXPECT_EQ(files.read(path).value(), "101\r\n");
+}
+
+TEST_F(FilesTest, SnapshotsOfAListStayUntilRefreshed) {
+    put("a.jpg");
+    FileList list(files, QStringLiteral("*.jpg"));
+    EXPECT_EQ(list.count(), 0);
+    list.setFolder(QStringLiteral("C:\\"));
+    put("b.jpg");
+    EXPECT_EQ(list.count(), 1);
+    list.refresh();
+    EXPECT_EQ(list.count(), 2);
+    EXPECT_EQ(list.name(1), QStringLiteral("b.jpg"));
+    EXPECT_EQ(list.name(-1), QString());
+    list.setPattern(QStringLiteral("*.txt"));
+    EXPECT_EQ(list.count(), 0);
+}
+
+} // namespace
+} // namespace lumora

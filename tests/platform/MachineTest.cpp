@@ -1,0 +1,60 @@
+#include "platform/QtEventPump.h"
+#include "platform/StatVolume.h"
+
+#include <QCoreApplication>
+#include <QElapsedTimer>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+TEST(QtEventPump, LetsATimerRunWhileALoopGoesOn) {
+    QtEventPump pump;
+    bool ran = false;
+    QTimer::singleShot(0, [&] { ran = true; });
+    QElapsedTimer waiting;
+    waiting.start();
+    while (!ran && waiting.elapsed() < 5000)
+        pump.pump();
+    EXPECT_TRUE(ran);
+}
+
+TEST(QtEventPump, TellsAHandlerInsideThatAPumpIsUnderWay) {
+    QtEventPump pump;
+    int depth = 0;
+    QTimer::singleShot(0, [&] {
+        depth = pump.pumping() ? 1 : -1;
+        pump.pump(); // a handler that pumps in its turn comes back
+    });
+    QElapsedTimer waiting;
+    waiting.start();
+    while (depth == 0 && waiting.elapsed() < 5000)
+        pump.pump();
+    EXPECT_EQ(depth, 1);
+    EXPECT_FALSE(pump.pumping());
+}
+
+TEST(StatVolume, GivesAStableNumberAlsoBeforeTheFolderIsMade) {
+    QTemporaryDir folder;
+    const Drives drives(toHostPath(folder.path()) / "not" / "yet", u'C', {});
+    const StatVolume volume(drives);
+    const auto before = volume.serial(QStringLiteral("C:\\"));
+    ASSERT_TRUE(before) << before.failure().message.toStdString();
+    std::filesystem::create_directories(drives.dataFolder());
+    EXPECT_EQ(*volume.serial(QStringLiteral("C:\\")), *before);
+    EXPECT_NE(*before, 0);
+    EXPECT_FALSE(volume.serial(QStringLiteral("Q:\\")));
+}
+
+TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
+    EXPECT_EQ(serialOfUuid(QStringLiteral("1234-ABCD")), 0x1234ABCD);
+    EXPECT_EQ(serialOfUuid(QStringLiteral("F000-0001")), static_cast<std::int32_t>(0xF0000001U));
+    EXPECT_NE(serialOfUuid(QStringLiteral("0a1b2c3d-0000-4000-8000-000000000001")),
+              serialOfUuid(QStringLiteral("0a1b2c3d-0000-4000-8000-000000000002")));
+}
+
+} // namespace
+} // namespace lumora
