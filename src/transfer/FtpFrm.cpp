@@ -279,7 +279,9 @@ void FtpFrm::Image5_Click() {
 void FtpFrm::leaveProgram() {
     m_room->desk.left = true;
     stopTimers();
-    m_room->session.closeSession();
+    // A pass that is under way may stand in a call of the session; it closes at its next step.
+    if (!sending)
+        m_room->session.closeSession();
     m_chain.endProgram();
 }
 

@@ -37,8 +37,10 @@ void FtpFrm::Command12_Click() {
         return;
     enter(Phase::Sending);
     const Phase end = RunAttempts();
-    if (m_room->desk.left)
+    if (m_room->desk.left) {
+        m_room->session.closeSession();
         return;
+    }
     finish(end);
     if (end == Phase::Success || end == Phase::NotAll)
         Command26_Click();
