@@ -11,16 +11,16 @@ struct SessionState;
 
 // Paths of the workspace under the drive root. They are drive paths.
 namespace WorkspacePaths {
-QString root(const SessionState& state);          // 2000lumora
-QString zmany(const SessionState& state);         // passing files
-QString ktanim(const SessionState& state);        // small views that the editor stored
-QString tempred(const SessionState& state);       // working files of the red-eye page
-QString jobFolder(const SessionState& state);     // texts and thumbnails of the order in preparation
-QString misgarot(const SessionState& state);      // frames
-QString orders(const SessionState& state);        // !!000: staging, one sub-folder an order
+QString root(const SessionState& state);           // 2000lumora
+QString zmany(const SessionState& state);          // passing files
+QString ktanim(const SessionState& state);         // small views that the editor stored
+QString tempred(const SessionState& state);        // working files of the red-eye page
+QString jobFolder(const SessionState& state);      // texts and thumbnails of the order in preparation
+QString misgarot(const SessionState& state);       // frames
+QString orders(const SessionState& state);         // !!000: staging, one sub-folder an order
 QString scratchPicture(const SessionState& state); // ^^^.jpg, the picture of the current step
-QString counter(const SessionState& state);       // vedron\mispar.txt
-QString proofPicture(const SessionState& state);  // 000.jpg
+QString counter(const SessionState& state);        // vedron\mispar.txt
+QString proofPicture(const SessionState& state);   // 000.jpg
 } // namespace WorkspacePaths
 
 // The folder tree on the program's own drive and its clean-up before each order.
@@ -28,18 +28,18 @@ class Workspace {
 public:
     Workspace(SessionState& state, const Files& files)
         : m_state(state)
-        , m_files(files)
-    {
-    }
+        , m_files(files) {}
 
     // 2000lumora and 2000lumora\zmany. True if the second then exists; a failed creation is not reported.
     bool MakeRootFolders() const;
-    // The whole tree but for the two below, each only if missing, in the order that a fresh drive shows. The failure names the folder.
+    // The whole tree but for the two below, each only if missing, in the order that a fresh drive shows. The failure
+    // names the folder.
     Result<void> MakeWorkspace() const;
     Result<void> MakeCounterFolder() const;
     Result<void> MakeOrderFolder() const;
 
-    // Empties the scratch folders, writes mana.txt afresh, reads the order number. Files that may not or cannot be deleted are passed over.
+    // Empties the scratch folders, writes mana.txt afresh, reads the order number. Files that may not or cannot be
+    // deleted are passed over.
     Result<void> CleanWorkspace() const;
 
     // Removes the print files of the orders already made, but for the file at index 0 of each folder.
@@ -49,7 +49,7 @@ public:
     Result<void> writeCounter() const;
 
 private:
-    void deleteMatching(const QString& folder, const QString& pattern, const QString& ending) const;
+    void deleteMatching(const QString& folder, const QString& ending) const;
 
     SessionState& m_state;
     const Files& m_files;

@@ -58,6 +58,13 @@ public:
     void Command7_Click() {}
     void Command8_Click();
     void Command9_Click() {}
+    // Builds the settings text of the profile, writes the settings file and shows both forms of it.
+    void BuildSettingsText();
+    // Fetches the remote copy to the settings file; tells nothing of a failure.
+    void DownloadSettings();
+    // The lines of the settings file into List2; "No Server" for a file that is missing or is not this client's.
+    void ReadSettingsFile(const QString& path);
+    void SplitSettingsText(const QString& text);
 
     // --- state ---
 
@@ -117,13 +124,14 @@ private:
     void showProfile();
     void startWith(const QString& code);
     void handOver();
-    void openWebPage(const QString& url);
+    QString settingsFile() const;
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     const Deployment& m_deployment;
-    int m_pictureStep = 0;
+    int m_pictureStep = 0; // nothing moves until the picture has once been at a limit
+    bool m_leaving = false;
 };
 
 } // namespace lumora

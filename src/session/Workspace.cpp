@@ -1,0 +1,164 @@
+#include "session/Workspace.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "session/SessionState.h"
+
+#include <optional>
+
+namespace lumora {
+
+namespace {
+
+// The largest number that a counter is believed: it must fit, with one added, wherever an order number goes.
+constexpr long long largestNumber = 999999999;
+
+QString counterFolder(const SessionState& state) {
+    return state.DiskRoot + QStringLiteral("vedron");
+}
+
+// Blanks in front are passed over and digits are taken up to the first other character: "007x" is 7, rubbish is 0.
+long long counterValue(const QString& line) {
+    long long value = 0;
+    for (const QChar digit : line.trimmed()) {
+        if (digit < u'0' || digit > u'9')
+            break;
+        value = std::min(value * 10 + (digit.unicode() - u'0'), largestNumber);
+    }
+    return value;
+}
+
+// The first line of a stored text; nothing for a text without any byte.
+std::optional<QString> firstLine(const QByteArray& bytes) {
+    if (bytes.isEmpty())
+        return std::nullopt;
+    QByteArray line = bytes.left(bytes.indexOf('\n'));
+    if (line.endsWith('\r'))
+        line.chop(1);
+    return AnsiCodePage::decode(line);
+}
+
+} // namespace
+
+namespace WorkspacePaths {
+
+QString root(const SessionState& state) {
+    return state.DiskRoot + QStringLiteral("2000lumora");
+}
+
+QString zmany(const SessionState& state) {
+    return root(state) + QStringLiteral("\\zmany");
+}
+
+QString ktanim(const SessionState& state) {
+    return zmany(state) + QStringLiteral("\\ktanim");
+}
+
+QString tempred(const SessionState& state) {
+    return zmany(state) + QStringLiteral("\\tempred");
+}
+
+QString jobFolder(const SessionState& state) {
+    return zmany(state) + QStringLiteral("\\job_folder");
+}
+
+QString misgarot(const SessionState& state) {
+    return root(state) + QStringLiteral("\\misgarot");
+}
+
+QString orders(const SessionState& state) {
+    return root(state) + QStringLiteral("\\!!000");
+}
+
+QString scratchPicture(const SessionState& state) {
+    return orders(state) + QStringLiteral("\\^^^.jpg");
+}
+
+QString counter(const SessionState& state) {
+    return counterFolder(state) + QStringLiteral("\\mispar.txt");
+}
+
+QString proofPicture(const SessionState& state) {
+    return root(state) + QStringLiteral("\\000.jpg");
+}
+
+} // namespace WorkspacePaths
+
+bool Workspace::MakeRootFolders() const {
+    // The answer counts, not the attempts: an older tree on a drive that has become read-only still serves.
+    (void)m_files.makeFolder(WorkspacePaths::root(m_state));
+    (void)m_files.makeFolder(WorkspacePaths::zmany(m_state));
+    return m_files.folderExists(WorkspacePaths::zmany(m_state));
+}
+
+Result<void> Workspace::MakeWorkspace() const {
+    for (const QString& folder :
+         {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), WorkspacePaths::jobFolder(m_state),
+          WorkspacePaths::ktanim(m_state), WorkspacePaths::tempred(m_state), WorkspacePaths::misgarot(m_state)}) {
+        if (const Result<void> made = m_files.makeFolder(folder); !made)
+            return made;
+    }
+    return {};
+}
+
+Result<void> Workspace::MakeCounterFolder() const {
+    return m_files.makeFolder(counterFolder(m_state));
+}
+
+Result<void> Workspace::MakeOrderFolder() const {
+    return m_files.makeFolder(WorkspacePaths::orders(m_state));
+}
+
+Result<void> Workspace::CleanWorkspace() const {
+    const QString orders = WorkspacePaths::orders(m_state);
+    deleteMatching(WorkspacePaths::ktanim(m_state), QStringLiteral("jpg"));
+    deleteMatching(WorkspacePaths::tempred(m_state), QStringLiteral("jpg"));
+    for (const QString& ending : {QStringLiteral("txt"), QStringLiteral("jpg"), QStringLiteral("bmp")})
+        deleteMatching(WorkspacePaths::jobFolder(m_state), ending);
+    for (const QString& ending : {QStringLiteral("gbr"), QStringLiteral("jpg"), QStringLiteral("gbx")})
+        deleteMatching(orders, ending);
+
+    const Result<void> written = m_files.writeWhole(orders + QStringLiteral("\\mana.txt"), QByteArrayLiteral("1\r\n"));
+
+    const QString counter = WorkspacePaths::counter(m_state);
+    if (!m_files.fileExists(counter)) {
+        m_state.MisparHazmana = QStringLiteral("100");
+    } else if (const Result<QByteArray> bytes = m_files.read(counter)) {
+        // A counter without a line, like one that can't be read, leaves the number as it was.
+        if (const std::optional<QString> line = firstLine(*bytes))
+            m_state.MisparHazmana = QString::number(counterValue(*line));
+    }
+
+    (void)m_files.removeFile(orders + QStringLiteral("\\111.jpg"));
+    return written;
+}
+
+void Workspace::CleanHistory() const {
+    const QString orders = WorkspacePaths::orders(m_state);
+    for (const QString& order : m_files.folders(orders)) {
+        const QString folder = JoinDrivePath(orders, order);
+        const QStringList names = m_files.names(folder, QStringLiteral("*.*"));
+        // The first file of a folder is its order sheet, which stays as the record of the order.
+        for (qsizetype i = 1; i < names.size(); ++i) {
+            if (names[i].endsWith(u"jpp"))
+                (void)m_files.removeFile(JoinDrivePath(folder, names[i]));
+        }
+    }
+}
+
+Result<void> Workspace::writeCounter() const {
+    if (const Result<void> made = MakeCounterFolder(); !made)
+        return made;
+    const long long next = counterValue(m_state.MisparHazmana) + 1;
+    return m_files.writeWhole(WorkspacePaths::counter(m_state), QByteArray::number(next) + "\r\n");
+}
+
+// The pattern knows no letter case, the test of the ending does: "a.Jpg" stays, and so does what can't be deleted.
+void Workspace::deleteMatching(const QString& folder, const QString& ending) const {
+    for (const QString& name : m_files.names(folder, QStringLiteral("*.") + ending)) {
+        if (name.endsWith(ending) || name.endsWith(ending.toUpper()))
+            (void)m_files.removeFile(JoinDrivePath(folder, name));
+    }
+}
+
+} // namespace lumora
