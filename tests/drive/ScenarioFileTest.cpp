@@ -1,0 +1,99 @@
+#include "drive/ScenarioFile.h"
+
+#include <gtest/gtest.h>
+
+using namespace lumora;
+
+namespace {
+
+ScenarioCommand only(const char* line) {
+    const auto file = ScenarioFile::parse(line, QStringLiteral("s"));
+    EXPECT_TRUE(file.ok()) << line << ": " << (file ? "" : file.failure().message.toStdString());
+    EXPECT_EQ(file ? file->commands().size() : 0U, 1U) << line;
+    return file && !file->commands().empty() ? file->commands().front() : ScenarioCommand{};
+}
+
+} // namespace
+
+TEST(ScenarioFile, TakesTheArgumentsOfEachCommand) {
+    const ScenarioCommand page = only("page FtpFrm 2.5");
+    EXPECT_EQ(page.page, u"FtpFrm");
+    EXPECT_EQ(page.seconds, 2.5);
+    EXPECT_EQ(only("page nnn  # the details").seconds, 30);
+
+    const ScenarioCommand press = only("  press nnn.Image1(0)\t# the first tile");
+    EXPECT_EQ(press.verb, ScenarioVerb::Press);
+    EXPECT_EQ(press.page, u"nnn");
+    EXPECT_EQ(press.control, u"Image1(0)");
+
+    EXPECT_TRUE(only("tick nnn.Check1 1").yes);
+    EXPECT_FALSE(only("answer no").yes);
+    EXPECT_TRUE(only("expect-visible Form2.List1 yes").yes);
+    EXPECT_EQ(only("expect-count FtpFrm.List3 12").number, 12);
+    EXPECT_EQ(only("pause 250").seconds, 0.25);
+    EXPECT_EQ(only("shot start").text, u"start");
+
+    const ScenarioCommand item = only("expect-item kyoskNew.List1 3 121015GNBC:\\\\pics\\\\a b.jpg");
+    EXPECT_EQ(item.number, 3);
+    EXPECT_EQ(item.text, u"121015GNBC:\\pics\\a b.jpg");
+
+    const ScenarioCommand until = only("until FtpFrm.Label4 20.0 all is there # really");
+    EXPECT_EQ(until.seconds, 20);
+    EXPECT_EQ(until.text, u"all is there # really");
+}
+
+TEST(ScenarioFile, TakesTextsAsTheyStandToTheEndOfTheLine) {
+    struct Case {
+        const char* line;
+        const char16_t* text;
+    };
+    const Case cases[] = {
+        {"type nnn.Text1 Dana Levi", u"Dana Levi"},
+        {"type nnn.Text1 דנה לוי", u"דנה לוי"},
+        {"type nnn.Text1", u""},
+        {"type nnn.Text1 ", u""},
+        {"type nnn.Text1  two blanks lead, one trails ", u" two blanks lead, one trails "},
+        {"type nnn.Text1 one\\ntwo", u"one\ntwo"},
+        {"type nnn.Text1 a\\\\name", u"a\\name"},
+        {"type nnn.Text1 C:\\pics\\", u"C:\\pics\\"},
+        {"type nnn.Text1 # 1\r", u"# 1"},
+        {"expect-message  נא לבחור", u" נא לבחור"},
+    };
+    for (const Case& one : cases)
+        EXPECT_EQ(only(one.line).text, QStringView(one.text)) << one.line;
+}
+
+TEST(ScenarioFile, TellsTheFirstBadLineWithItsNumber) {
+    const char* const bad[] = {
+        "dance nnn.Command1",
+        "press",
+        "press Command1",
+        "press nnn.",
+        "press .Command1",
+        "press nnn.Command1 twice",
+        "tick nnn.Check1 yes",
+        "tick nnn.Check1",
+        "answer maybe",
+        "expect-visible nnn.Label1",
+        "expect-count a.b -1",
+        "expect-count a.b 1.5",
+        "expect-item a.b x text",
+        "until a.b soon text",
+        "pause a while",
+        "pause nan",
+        "page",
+        "page nnn soon",
+        "choose nnn.Combo1",
+        "pick ",
+        "shot ../secret",
+        "press # nnn.Command1",
+    };
+    for (const char* line : bad) {
+        const auto file = ScenarioFile::parse(QByteArray("# a comment\n\npress nnn.Command1\n") + line + "\nnonsense\n",
+                                              QStringLiteral("demo/a.scenario"));
+        ASSERT_FALSE(file.ok()) << line;
+        EXPECT_TRUE(file.failure().message.startsWith(u"demo/a.scenario:4: ")) << file.failure().message.toStdString();
+    }
+    EXPECT_FALSE(ScenarioFile::parse("type nnn.Text1 \xE9\xEA", QStringLiteral("s")).ok());
+    EXPECT_FALSE(ScenarioFile::load(QStringLiteral("/nowhere/a.scenario")).ok());
+}

@@ -1,0 +1,253 @@
+#include "drive/ScenarioFile.h"
+
+#include <QFile>
+#include <QStringDecoder>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <optional>
+
+namespace lumora {
+
+namespace {
+
+enum class Takes {
+    Page,
+    Control,
+    Seconds,
+    OptionalSeconds,
+    Milliseconds,
+    Number,
+    Flag,  // 0 or 1
+    YesNo, // yes or no
+    Word,
+    Text,     // to the end of the line, may be empty
+    SomeText, // the same, but not empty
+};
+
+struct Grammar {
+    ScenarioVerb verb;
+    const char* word;
+    std::vector<Takes> takes;
+    const char* help;
+};
+
+constexpr double patienceOfPage = 30; // seconds, where the line names none
+
+const std::array<Grammar, 16>& grammars() {
+    static const std::array<Grammar, 16> all{{
+        {ScenarioVerb::Page,
+         "page",
+         {Takes::Page, Takes::OptionalSeconds},
+         "NAME [SECONDS]: wait until that page is in front"},
+        {ScenarioVerb::Press, "press", {Takes::Control}, "PAGE.CONTROL"},
+        {ScenarioVerb::Type, "type", {Takes::Control, Takes::Text}, "PAGE.CONTROL TEXT: replaces what the box holds"},
+        {ScenarioVerb::Choose,
+         "choose",
+         {Takes::Control, Takes::SomeText},
+         "PAGE.CONTROL TEXT: a row of a list or a combo box"},
+        {ScenarioVerb::Tick, "tick", {Takes::Control, Takes::Flag}, "PAGE.CONTROL 0|1"},
+        {ScenarioVerb::Pick,
+         "pick",
+         {Takes::SomeText},
+         "HOSTPATH: the answer of the next file dialog; of a folder its first picture"},
+        {ScenarioVerb::Answer, "answer", {Takes::YesNo}, "yes|no: of the next question box"},
+        {ScenarioVerb::Expect, "expect", {Takes::Control, Takes::Text}, "PAGE.CONTROL TEXT"},
+        {ScenarioVerb::ExpectVisible, "expect-visible", {Takes::Control, Takes::YesNo}, "PAGE.CONTROL yes|no"},
+        {ScenarioVerb::ExpectCount, "expect-count", {Takes::Control, Takes::Number}, "PAGE.LIST N"},
+        {ScenarioVerb::ExpectItem,
+         "expect-item",
+         {Takes::Control, Takes::Number, Takes::Text},
+         "PAGE.LIST N TEXT: N counts from 0"},
+        {ScenarioVerb::ExpectMessage, "expect-message", {Takes::Text}, "TEXT: of the oldest box not yet expected"},
+        {ScenarioVerb::Until,
+         "until",
+         {Takes::Control, Takes::Seconds, Takes::Text},
+         "PAGE.CONTROL SECONDS TEXT: wait for a text"},
+        {ScenarioVerb::Dump,
+         "dump",
+         {Takes::Control, Takes::SomeText},
+         "PAGE.CONTROL FILE: a text, or the items of a list"},
+        {ScenarioVerb::Shot, "shot", {Takes::Word}, "NAME: a PNG of the page in front"},
+        {ScenarioVerb::Pause, "pause", {Takes::Milliseconds}, "MILLISECONDS"},
+    }};
+    return all;
+}
+
+bool isBlank(QChar c) {
+    return c == u' ' || c == u'\t';
+}
+
+// "\n" is a line break and "\\" a backslash; a backslash before anything else is itself.
+QString unescaped(const QString& text) {
+    QString result;
+    for (qsizetype i = 0; i < text.size(); ++i) {
+        const QChar next = i + 1 < text.size() ? text[i + 1] : QChar();
+        if (text[i] == u'\\' && (next == u'n' || next == u'\\')) {
+            result += next == u'n' ? u'\n' : u'\\';
+            ++i;
+        } else {
+            result += text[i];
+        }
+    }
+    return result;
+}
+
+// What is left of a line, taken word by word.
+class Rest {
+public:
+    explicit Rest(QString text)
+        : m_text(std::move(text)) {}
+
+    // Empty at the end of the line. One blank behind the word goes with it: a text begins right after that.
+    QString word() {
+        qsizetype begin = 0;
+        while (begin < m_text.size() && isBlank(m_text[begin]))
+            ++begin;
+        qsizetype end = begin;
+        while (end < m_text.size() && !isBlank(m_text[end]))
+            ++end;
+        const QString result = m_text.mid(begin, end - begin);
+        m_text = m_text.mid(end + 1);
+        return result;
+    }
+    QString text() { return std::exchange(m_text, {}); }
+    bool nothingLeft() const {
+        const QString left = m_text.trimmed();
+        return left.isEmpty() || left.startsWith(u'#');
+    }
+
+private:
+    QString m_text;
+};
+
+std::optional<double> numberIn(const QString& word) {
+    bool ok = false;
+    const double number = word.toDouble(&ok);
+    return ok && std::isfinite(number) && number >= 0 ? std::optional(number) : std::nullopt;
+}
+
+// What is wrong with this argument, or nothing.
+QString take(Takes what, Rest& rest, ScenarioCommand& command) {
+    if (what == Takes::Text || what == Takes::SomeText) {
+        command.text = unescaped(rest.text());
+        return what == Takes::SomeText && command.text.trimmed().isEmpty() ? QStringLiteral("a text is missing")
+                                                                           : QString();
+    }
+    if (what == Takes::OptionalSeconds) {
+        command.seconds = patienceOfPage;
+        if (rest.nothingLeft())
+            return {};
+    }
+
+    const QString word = rest.word();
+    if (word.isEmpty() || word.startsWith(u'#'))
+        return QStringLiteral("the line ends too early");
+    const std::optional<double> number = numberIn(word);
+    switch (what) {
+    case Takes::Page:
+        command.page = word;
+        return {};
+    case Takes::Control: {
+        const qsizetype dot = word.indexOf(u'.');
+        command.page = word.left(dot);
+        command.control = word.mid(dot + 1);
+        if (dot < 1 || command.control.isEmpty())
+            return QStringLiteral("PAGE.CONTROL is wanted, not \"%1\"").arg(word);
+        return {};
+    }
+    case Takes::Word:
+        command.text = word;
+        if (word.contains(u'/'))
+            return QStringLiteral("a name without \"/\" is wanted, not \"%1\"").arg(word);
+        return {};
+    case Takes::Seconds:
+    case Takes::OptionalSeconds:
+    case Takes::Milliseconds:
+        if (!number)
+            return QStringLiteral("a time is wanted, not \"%1\"").arg(word);
+        command.seconds = what == Takes::Milliseconds ? *number / 1000 : *number;
+        return {};
+    case Takes::Number:
+        if (!number || *number != std::floor(*number) || *number > 1e9)
+            return QStringLiteral("a whole number is wanted, not \"%1\"").arg(word);
+        command.number = static_cast<int>(*number);
+        return {};
+    case Takes::Flag:
+    case Takes::YesNo: {
+        const QString on = what == Takes::Flag ? QStringLiteral("1") : QStringLiteral("yes");
+        const QString off = what == Takes::Flag ? QStringLiteral("0") : QStringLiteral("no");
+        command.yes = word == on;
+        if (word != on && word != off)
+            return QStringLiteral("%1 or %2 is wanted, not \"%3\"").arg(on, off, word);
+        return {};
+    }
+    case Takes::Text:
+    case Takes::SomeText:
+        break;
+    }
+    return {};
+}
+
+QString parseLine(const QString& text, ScenarioCommand& command) {
+    Rest rest(text);
+    const QString verb = rest.word();
+    const auto grammar = std::find_if(grammars().begin(), grammars().end(),
+                                      [&](const Grammar& one) { return verb == QLatin1StringView(one.word); });
+    if (grammar == grammars().end())
+        return QStringLiteral("there is no command \"%1\"").arg(verb);
+    command.verb = grammar->verb;
+    for (const Takes what : grammar->takes) {
+        const QString wrong = take(what, rest, command);
+        if (!wrong.isEmpty())
+            return QStringLiteral("%1: %2 (%1 %3)").arg(verb, wrong, QLatin1StringView(grammar->help));
+    }
+    if (!rest.nothingLeft())
+        return QStringLiteral("%1: too much on the line: \"%2\"").arg(verb, rest.text().trimmed());
+    return {};
+}
+
+} // namespace
+
+Result<ScenarioFile> ScenarioFile::parse(const QByteArray& bytes, const QString& name) {
+    QStringDecoder decoder(QStringDecoder::Utf8);
+    const QString whole = decoder(bytes);
+    if (decoder.hasError())
+        return Failure{Failure::Kind::Damaged, QStringLiteral("%1:1: the file is not in UTF-8").arg(name)};
+
+    ScenarioFile file;
+    file.m_name = name;
+    int number = 0;
+    for (QString line : whole.split(u'\n')) {
+        ++number;
+        if (line.endsWith(u'\r'))
+            line.chop(1);
+        const QString bare = line.trimmed();
+        if (bare.isEmpty() || bare.startsWith(u'#'))
+            continue;
+        ScenarioCommand command;
+        command.line = number;
+        const QString wrong = parseLine(line, command);
+        if (!wrong.isEmpty())
+            return Failure{Failure::Kind::Damaged, QStringLiteral("%1:%2: %3").arg(name).arg(number).arg(wrong)};
+        file.m_commands.push_back(std::move(command));
+    }
+    return file;
+}
+
+Result<ScenarioFile> ScenarioFile::load(const QString& hostPath) {
+    QFile file(hostPath);
+    if (!file.open(QIODevice::ReadOnly))
+        return Failure{Failure::Kind::NotFound, QStringLiteral("%1: %2").arg(hostPath, file.errorString())};
+    return parse(file.readAll(), hostPath);
+}
+
+QString scenarioHelp() {
+    QString text;
+    for (const Grammar& grammar : grammars())
+        text += QStringLiteral("  %1 %2\n").arg(QLatin1StringView(grammar.word), QLatin1StringView(grammar.help));
+    return text;
+}
+
+} // namespace lumora
