@@ -1,16 +1,13 @@
 #include "platform/Files.h"
 
 #include "common/AnsiCodePage.h"
+#include "platform/NewContent.h"
 
-#include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <cerrno>
-#include <cstring>
-#include <memory>
-#include <utility>
 
 namespace lumora {
 namespace fs = std::filesystem;
@@ -22,118 +19,6 @@ constexpr qint64 largestRead = qint64(1) << 30;
 Failure failure(Failure::Kind kind, const QString& path, const QString& reason) {
     return {kind, QStringLiteral("%1: %2").arg(path, reason)};
 }
-
-Failure systemFailure(int error, const QString& path) {
-    auto kind = Failure::Kind::Other;
-    switch (error) {
-    case ENOENT:
-    case ENOTDIR:
-        kind = Failure::Kind::NotFound;
-        break;
-    case EACCES:
-    case EPERM:
-    case EROFS:
-        kind = Failure::Kind::AccessDenied;
-        break;
-    case ENOSPC:
-    case EDQUOT:
-        kind = Failure::Kind::NoSpace;
-        break;
-    case EFBIG:
-        kind = Failure::Kind::TooLarge;
-        break;
-    default:
-        break;
-    }
-    return failure(kind, path, QString::fromLocal8Bit(std::strerror(error)));
-}
-
-class Descriptor {
-public:
-    explicit Descriptor(int number)
-        : m_number(number) {}
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-    ~Descriptor() { close(); }
-
-    bool valid() const { return m_number >= 0; }
-    int number() const { return m_number; }
-    int close() { return m_number < 0 ? 0 : ::close(std::exchange(m_number, -1)); }
-
-private:
-    int m_number;
-};
-
-// For reading only, and only what is a plain file: a pipe would wait for ever.
-Result<std::unique_ptr<Descriptor>> openSource(const HostPath& host, const QString& path) {
-    auto source = std::make_unique<Descriptor>(::open(host.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
-    struct stat status {};
-    if (!source->valid() || ::fstat(source->number(), &status) != 0)
-        return systemFailure(errno, path);
-    if (!S_ISREG(status.st_mode))
-        return failure(Failure::Kind::Unsupported, path, QStringLiteral("not a file"));
-    return source;
-}
-
-// The new content of a file, beside it under a hidden name until it is whole.
-class NewContent {
-public:
-    NewContent(HostPath target, QString path)
-        : m_target(std::move(target))
-        , m_path(std::move(path)) {
-        std::string name = (m_target.parent_path() / ".lumora-XXXXXX").native();
-        m_file = std::make_unique<Descriptor>(::mkostemp(name.data(), O_CLOEXEC));
-        if (m_file->valid())
-            m_temporary = name;
-        else
-            m_error = errno;
-    }
-    NewContent(const NewContent&) = delete;
-    NewContent& operator=(const NewContent&) = delete;
-    ~NewContent() {
-        if (!m_temporary.empty())
-            ::unlink(m_temporary.c_str());
-    }
-
-    void append(const char* bytes, std::size_t count) {
-        while (m_error == 0 && count > 0) {
-            const ssize_t written = ::write(m_file->number(), bytes, count);
-            if (written < 0 && errno == EINTR)
-                continue;
-            if (written < 0) {
-                m_error = errno;
-                return;
-            }
-            bytes += written;
-            count -= static_cast<std::size_t>(written);
-        }
-    }
-
-    Result<void> commit() {
-        if (m_error == 0 && ::fsync(m_file->number()) != 0)
-            m_error = errno;
-        if (m_error == 0 && m_file->close() != 0)
-            m_error = errno;
-        if (m_error == 0 && ::rename(m_temporary.c_str(), m_target.c_str()) != 0)
-            m_error = errno;
-        if (m_error != 0)
-            return systemFailure(m_error, m_path);
-        m_temporary.clear();
-        // The new name is not on the disk before its folder is; where a file system has no such call the file itself is
-        // still whole.
-        const Descriptor folder(::open(m_target.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-        if (folder.valid())
-            ::fsync(folder.number());
-        return {};
-    }
-
-private:
-    HostPath m_target;
-    QString m_path;
-    std::unique_ptr<Descriptor> m_file;
-    HostPath m_temporary;
-    int m_error = 0;
-};
 
 // "*" any run of characters, "?" any one.
 bool matches(QStringView pattern, QStringView name) {
@@ -252,16 +137,14 @@ Result<QByteArray> Files::read(const QString& path) const {
     QByteArray bytes;
     QByteArray part(qsizetype(1) << 16, Qt::Uninitialized);
     for (;;) {
-        const ssize_t count = ::read((*source)->number(), part.data(), static_cast<std::size_t>(part.size()));
-        if (count < 0 && errno == EINTR)
-            continue;
-        if (count < 0)
-            return systemFailure(errno, path);
-        if (count == 0)
+        const auto count = readSome(*source, part.data(), static_cast<std::size_t>(part.size()), path);
+        if (!count)
+            return count.failure();
+        if (*count == 0)
             return bytes;
-        if (bytes.size() + count > largestRead)
+        bytes.append(part.constData(), static_cast<qsizetype>(*count));
+        if (bytes.size() > largestRead)
             return systemFailure(EFBIG, path);
-        bytes.append(part.constData(), count);
     }
 }
 
@@ -287,14 +170,12 @@ Result<void> Files::copyFile(const QString& source, const QString& target) const
     NewContent content(*to, target);
     QByteArray part(qsizetype(1) << 20, Qt::Uninitialized);
     for (;;) {
-        const ssize_t count = ::read((*opened)->number(), part.data(), static_cast<std::size_t>(part.size()));
-        if (count < 0 && errno == EINTR)
-            continue;
-        if (count < 0)
-            return systemFailure(errno, source);
-        if (count == 0)
+        const auto count = readSome(*opened, part.data(), static_cast<std::size_t>(part.size()), source);
+        if (!count)
+            return count.failure();
+        if (*count == 0)
             return content.commit();
-        content.append(part.constData(), static_cast<std::size_t>(count));
+        content.append(part.constData(), *count);
     }
 }
 

@@ -61,7 +61,8 @@ public:
     // count as blanks and "#" does not cut. The answer's body whatever the status is.
     virtual Result<QByteArray> fetch(const QString& url) = 0;
 
-    // GET into a file, written whole or not at all; an answer of 400 or more is a failure and leaves no file.
+    // GET into a file, written whole or not at all; an answer of another status than 200 to 299 is a failure and leaves
+    // no file.
     virtual Result<void> download(const QString& url, const HostPath& target) = 0;
 };
 

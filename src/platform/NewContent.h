@@ -1,0 +1,61 @@
+#pragma once
+
+#include "common/Result.h"
+#include "platform/HostPath.h"
+
+#include <QString>
+
+namespace lumora {
+
+// What errno says, as a failure whose message names the path.
+Failure systemFailure(int error, const QString& path);
+
+// A file descriptor that is closed at the end.
+class Descriptor {
+public:
+    explicit Descriptor(int number = -1)
+        : m_number(number) {}
+    Descriptor(Descriptor&& other) noexcept;
+    Descriptor& operator=(Descriptor&& other) noexcept;
+    ~Descriptor() { close(); }
+
+    bool valid() const { return m_number >= 0; }
+    int number() const { return m_number; }
+    int close();
+
+private:
+    int m_number;
+};
+
+// For reading only, and only what is a plain file: a pipe would wait for ever. path is what a failure names.
+Result<Descriptor> openSource(const HostPath& host, const QString& path);
+
+// The next bytes of an open file, up to the capacity given; 0 at the end.
+Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
+
+// The new content of a file, beside it under a hidden name until it is whole: a crash or a full disk leaves the old
+// file or the new one. Nothing stays behind when it is not committed.
+class NewContent {
+public:
+    // path is what a failure names.
+    NewContent(HostPath target, QString path);
+    NewContent(const NewContent&) = delete;
+    NewContent& operator=(const NewContent&) = delete;
+    ~NewContent();
+
+    // A failure is kept until commit and what is appended behind it is dropped.
+    void append(const char* bytes, std::size_t count);
+    bool failed() const { return m_error != 0; }
+
+    // Syncs and renames.
+    Result<void> commit();
+
+private:
+    HostPath m_target;
+    QString m_path;
+    HostPath m_temporary;
+    Descriptor m_file;
+    int m_error = 0;
+};
+
+} // namespace lumora
