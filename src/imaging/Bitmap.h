@@ -28,4 +28,7 @@ private:
     QImage m_image;
 };
 
+// The picture with white behind what is transparent.
+Bitmap onWhite(const Bitmap& picture);
+
 } // namespace lumora

@@ -1,6 +1,7 @@
 #include "imaging/JpegReader.h"
 
 #include "common/WholeFile.h"
+#include "imaging/ColourPlanes.h"
 #include "imaging/JpegErrors.h"
 
 #include <QSysInfo>
@@ -112,6 +113,34 @@ struct JpegReader::State {
         }
     }
 
+    bool inks() const { return info.jpeg_color_space == JCS_CMYK || info.jpeg_color_space == JCS_YCCK; }
+
+    bool start(int denominator, J_COLOR_SPACE colours) {
+        return errors.guarded([&] {
+            info.out_color_space = colours;
+            info.scale_num = 1;
+            info.scale_denom = static_cast<unsigned>(denominator);
+            info.dct_method = JDCT_ISLOW;
+            jpeg_start_decompress(&info);
+        });
+    }
+
+    // One line of 32-bit pixels; inkLine is room for one line of inks.
+    bool readLine(unsigned char* line, std::vector<unsigned char>& inkLine) {
+        JSAMPROW target = inkLine.empty() ? line : inkLine.data();
+        if (!errors.guarded([&] { jpeg_read_scanlines(&info, &target, 1); }))
+            return false;
+        if (!inkLine.empty())
+            convertInks(inkLine.data(), reinterpret_cast<QRgb*>(line), static_cast<int>(info.output_width),
+                        info.saw_Adobe_marker != FALSE);
+        return true;
+    }
+
+    // Reads to the end of the file's data, so that a file that is cut short behind the last line is found out too.
+    bool finish() {
+        return errors.guarded([&] { jpeg_finish_decompress(&info); });
+    }
+
     PictureInput input;
     JpegErrors errors;
     Source source;
@@ -157,33 +186,84 @@ PictureSize JpegReader::size() const {
 
 Result<Bitmap> JpegReader::readBitmap(int denominator) {
     State& s = *m_state;
-    const bool inks = s.info.jpeg_color_space == JCS_CMYK || s.info.jpeg_color_space == JCS_YCCK;
-    const bool started = s.errors.guarded([&s, inks, denominator] {
-        s.info.out_color_space = inks ? JCS_CMYK : bitmapColours;
-        s.info.scale_num = 1;
-        s.info.scale_denom = static_cast<unsigned>(denominator);
-        s.info.dct_method = JDCT_ISLOW;
-        jpeg_start_decompress(&s.info);
-    });
-    if (!started)
+    if (!s.start(denominator, s.inks() ? JCS_CMYK : bitmapColours))
         return s.failure();
-
-    const int width = static_cast<int>(s.info.output_width);
-    QImage image(width, static_cast<int>(s.info.output_height), QImage::Format_RGB32);
+    QImage image(static_cast<int>(s.info.output_width), static_cast<int>(s.info.output_height), QImage::Format_RGB32);
     if (image.isNull())
         return pictureFailure(s.input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
-    std::vector<unsigned char> inkLine(inks ? static_cast<std::size_t>(width) * 4 : 0);
+    std::vector<unsigned char> inks(s.inks() ? static_cast<std::size_t>(image.width()) * 4 : 0);
     for (int y = 0; y < image.height(); ++y) {
-        auto* line = image.scanLine(y);
-        JSAMPROW target = inks ? inkLine.data() : line;
-        if (!s.errors.guarded([&s, &target] { jpeg_read_scanlines(&s.info, &target, 1); }))
+        if (!s.readLine(image.scanLine(y), inks))
             return s.failure();
-        if (inks)
-            convertInks(inkLine.data(), reinterpret_cast<QRgb*>(line), width, s.info.saw_Adobe_marker != FALSE);
     }
-    if (!s.errors.guarded([&s] { jpeg_finish_decompress(&s.info); }))
+    if (!s.finish())
         return s.failure();
     return Bitmap(std::move(image));
+}
+
+bool JpegReader::hasPlanes() const {
+    return m_state->info.jpeg_color_space == JCS_YCbCr || m_state->info.jpeg_color_space == JCS_GRAYSCALE;
+}
+
+Result<void> JpegReader::readPlanes(int denominator, PlaneTaker& taker) {
+    State& s = *m_state;
+    const bool raw = hasPlanes();
+    s.info.raw_data_out = raw ? TRUE : FALSE;
+    s.info.do_fancy_upsampling = raw ? FALSE : TRUE;
+    if (!s.start(denominator, raw ? s.info.jpeg_color_space : s.inks() ? JCS_CMYK : bitmapColours))
+        return s.failure();
+    return raw ? readRawPlanes(taker) : readMadePlanes(taker);
+}
+
+Result<void> JpegReader::readRawPlanes(PlaneTaker& taker) {
+    State& s = *m_state;
+    std::vector<PlaneLayout> planes;
+    std::vector<std::vector<JSAMPROW>> rows;
+    for (int i = 0; i < s.info.num_components; ++i) {
+        const jpeg_component_info& component = s.info.comp_info[i];
+        // A scaled decode shrinks each component by its own measure: often chroma less than luma.
+        const double shrunk = static_cast<double>(DCTSIZE) / component.DCT_scaled_size;
+        PlaneLayout plane;
+        plane.width = static_cast<int>(component.downsampled_width);
+        plane.height = static_cast<int>(component.downsampled_height);
+        plane.pitchX = shrunk * s.info.max_h_samp_factor / component.h_samp_factor;
+        plane.pitchY = shrunk * s.info.max_v_samp_factor / component.v_samp_factor;
+        plane.rowsAtOnce = component.v_samp_factor * component.DCT_scaled_size;
+        plane.rowBytes = static_cast<int>(component.width_in_blocks) * component.DCT_scaled_size;
+        planes.push_back(plane);
+        rows.emplace_back(static_cast<std::size_t>(plane.rowsAtOnce));
+    }
+    taker.begin(planes);
+
+    std::array<JSAMPARRAY, MAX_COMPONENTS> starts{};
+    const auto lines = static_cast<JDIMENSION>(s.info.max_v_samp_factor * s.info.min_DCT_scaled_size);
+    for (int step = 0; s.info.output_scanline < s.info.output_height; ++step) {
+        for (std::size_t i = 0; i < planes.size(); ++i) {
+            for (int y = 0; y < planes[i].rowsAtOnce; ++y)
+                rows[i][static_cast<std::size_t>(y)] = taker.row(static_cast<int>(i), step * planes[i].rowsAtOnce + y);
+            starts[i] = rows[i].data();
+        }
+        if (!s.errors.guarded([&s, &starts, lines] { jpeg_read_raw_data(&s.info, starts.data(), lines); }))
+            return s.failure();
+        taker.rowsReady();
+    }
+    return s.finish() ? Result<void>() : s.failure();
+}
+
+Result<void> JpegReader::readMadePlanes(PlaneTaker& taker) {
+    State& s = *m_state;
+    const int width = static_cast<int>(s.info.output_width);
+    const double pitch = static_cast<double>(s.info.scale_denom) / s.info.scale_num;
+    taker.begin(std::vector<PlaneLayout>(3, {width, static_cast<int>(s.info.output_height), pitch, pitch, 1, width}));
+    std::vector<QRgb> line(static_cast<std::size_t>(width));
+    std::vector<unsigned char> inks(s.inks() ? line.size() * 4 : 0);
+    for (int y = 0; y < static_cast<int>(s.info.output_height); ++y) {
+        if (!s.readLine(reinterpret_cast<unsigned char*>(line.data()), inks))
+            return s.failure();
+        lumaAndChroma(line.data(), width, taker.row(0, y), taker.row(1, y), taker.row(2, y));
+        taker.rowsReady();
+    }
+    return s.finish() ? Result<void>() : s.failure();
 }
 
 } // namespace lumora

@@ -4,6 +4,7 @@
 #include "imaging/Bitmap.h"
 #include "imaging/PictureFile.h"
 #include "imaging/PictureInput.h"
+#include "imaging/Planes.h"
 
 #include <memory>
 
@@ -25,9 +26,19 @@ public:
     // each side rounded up.
     Result<Bitmap> readBitmap(int denominator = 1);
 
+    // True when the file holds luma and chroma planes, or luma alone: then readPlanes gives them as they lie there. The
+    // planes of other pictures (RGB, inks) are made of whole pixels, which takes longer.
+    bool hasPlanes() const;
+
+    // The picture as luma and chroma, row by row; the reader is used up. denominator as above.
+    Result<void> readPlanes(int denominator, PlaneTaker& taker);
+
 private:
     struct State;
     explicit JpegReader(std::unique_ptr<State> state);
+
+    Result<void> readRawPlanes(PlaneTaker& taker);
+    Result<void> readMadePlanes(PlaneTaker& taker);
 
     std::unique_ptr<State> m_state;
 };

@@ -2,11 +2,9 @@
 
 #include "imaging/JpegErrors.h"
 
-#include <QPainter>
+#include <QSysInfo>
 
 #include <algorithm>
-#include <array>
-#include <memory>
 
 namespace lumora {
 
@@ -14,95 +12,101 @@ namespace {
 
 constexpr J_COLOR_SPACE bitmapColours = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? JCS_EXT_BGRX : JCS_EXT_XRGB;
 
-class Writer {
-public:
-    Writer() {
-        m_target.init_destination = [](j_compress_ptr) {};
-        m_target.empty_output_buffer = [](j_compress_ptr info) {
-            auto* writer = static_cast<Writer*>(info->client_data);
-            writer->m_bytes.append(reinterpret_cast<const char*>(writer->m_buffer.data()),
-                                   static_cast<qsizetype>(writer->m_buffer.size()));
-            writer->rewind();
+} // namespace
+
+struct JpegWriter::State {
+    State() {
+        target.init_destination = [](j_compress_ptr) {};
+        target.empty_output_buffer = [](j_compress_ptr compress) {
+            static_cast<State*>(compress->client_data)->take(bufferSize);
             return boolean{TRUE};
         };
-        m_target.term_destination = [](j_compress_ptr info) {
-            auto* writer = static_cast<Writer*>(info->client_data);
-            writer->m_bytes.append(reinterpret_cast<const char*>(writer->m_buffer.data()),
-                                   static_cast<qsizetype>(writer->m_buffer.size() - writer->m_target.free_in_buffer));
+        target.term_destination = [](j_compress_ptr compress) {
+            auto* state = static_cast<State*>(compress->client_data);
+            state->take(bufferSize - state->target.free_in_buffer);
         };
-        rewind();
     }
-    ~Writer() {
-        if (m_created)
-            jpeg_destroy_compress(&m_info);
+    ~State() {
+        if (created)
+            jpeg_destroy_compress(&info);
     }
-    Writer(const Writer&) = delete;
-    Writer& operator=(const Writer&) = delete;
+    State(const State&) = delete;
+    State& operator=(const State&) = delete;
 
-    bool begin(int width, int height, J_COLOR_SPACE input, int quality) {
-        m_info.err = m_errors.install();
-        return m_errors.guarded([&] {
-            jpeg_create_compress(&m_info);
-            m_created = true;
-            m_info.client_data = this;
-            m_info.dest = &m_target;
-            m_info.image_width = static_cast<JDIMENSION>(width);
-            m_info.image_height = static_cast<JDIMENSION>(height);
-            m_info.in_color_space = input;
-            m_info.input_components = input == JCS_YCbCr ? 3 : 4;
-            jpeg_set_defaults(&m_info);
-            jpeg_set_quality(&m_info, std::clamp(quality, 0, 100), TRUE);
-            m_info.dct_method = JDCT_ISLOW;
-            jpeg_start_compress(&m_info, TRUE);
-        });
+    void take(std::size_t count) {
+        bytes.append(reinterpret_cast<const char*>(buffer.data()), static_cast<qsizetype>(count));
+        target.next_output_byte = buffer.data();
+        target.free_in_buffer = bufferSize;
     }
 
-    bool line(const uchar* pixels) {
-        auto* row = const_cast<JSAMPROW>(pixels);
-        return m_errors.guarded([&] { jpeg_write_scanlines(&m_info, &row, 1); });
+    template <class Calls>
+    void run(const Calls& calls) {
+        ok = ok && errors.guarded(calls);
     }
 
-    bool finish() {
-        return m_errors.guarded([&] { jpeg_finish_compress(&m_info); });
-    }
-
-    QByteArray takeBytes() { return std::move(m_bytes); }
-    Failure failure() const { return {Failure::Kind::Other, QStringLiteral("JPEG writer: ") + m_errors.text}; }
-
-private:
-    void rewind() {
-        m_target.next_output_byte = m_buffer.data();
-        m_target.free_in_buffer = m_buffer.size();
-    }
-
-    JpegErrors m_errors;
-    jpeg_destination_mgr m_target{};
-    jpeg_compress_struct m_info{};
-    bool m_created = false;
-    QByteArray m_bytes;
-    std::array<JOCTET, 65536> m_buffer;
+    static constexpr std::size_t bufferSize = 65536;
+    JpegErrors errors;
+    jpeg_destination_mgr target{};
+    jpeg_compress_struct info{};
+    bool created = false;
+    bool ok = true;
+    QByteArray bytes;
+    std::array<JOCTET, bufferSize> buffer;
 };
 
-} // namespace
+JpegWriter::JpegWriter(PictureSize size, int quality, Input input)
+    : m_state(std::make_unique<State>()) {
+    State& s = *m_state;
+    s.info.err = s.errors.install();
+    s.run([&s, size, quality, input] {
+        jpeg_create_compress(&s.info);
+        s.created = true;
+        s.info.client_data = &s;
+        s.info.dest = &s.target;
+        s.target.next_output_byte = s.buffer.data();
+        s.target.free_in_buffer = State::bufferSize;
+        s.info.image_width = static_cast<JDIMENSION>(size.width);
+        s.info.image_height = static_cast<JDIMENSION>(size.height);
+        s.info.in_color_space = input == Input::Planes ? JCS_YCbCr : bitmapColours;
+        s.info.input_components = input == Input::Planes ? 3 : 4;
+        jpeg_set_defaults(&s.info);
+        jpeg_set_quality(&s.info, std::clamp(quality, 0, 100), TRUE);
+        s.info.dct_method = JDCT_ISLOW;
+        s.info.raw_data_in = input == Input::Planes ? TRUE : FALSE;
+        jpeg_start_compress(&s.info, TRUE);
+    });
+}
+
+JpegWriter::~JpegWriter() = default;
+
+void JpegWriter::line(const unsigned char* pixels) {
+    State& s = *m_state;
+    auto* row = const_cast<JSAMPROW>(pixels);
+    s.run([&s, &row] { jpeg_write_scanlines(&s.info, &row, 1); });
+}
+
+void JpegWriter::planeRows(PlaneRows& rows) {
+    State& s = *m_state;
+    std::array<JSAMPARRAY, 3> planes{rows.luma.data(), rows.cb.data(), rows.cr.data()};
+    s.run([&s, &planes] { jpeg_write_raw_data(&s.info, planes.data(), lumaRows); });
+}
+
+Result<QByteArray> JpegWriter::finish() {
+    State& s = *m_state;
+    s.run([&s] { jpeg_finish_compress(&s.info); });
+    if (!s.ok)
+        return Failure{Failure::Kind::Other, QStringLiteral("JPEG writer: ") + s.errors.text};
+    return std::move(s.bytes);
+}
 
 Result<QByteArray> writeJpeg(const Bitmap& picture, int quality) {
     if (picture.isNull())
         return Failure{Failure::Kind::Other, QStringLiteral("JPEG writer: the picture has no pixels")};
-    QImage opaque = picture.image();
-    if (opaque.hasAlphaChannel()) {
-        opaque = QImage(picture.width(), picture.height(), QImage::Format_RGB32);
-        opaque.fill(Qt::white);
-        QPainter(&opaque).drawImage(0, 0, picture.image());
-    }
-    opaque.convertTo(QImage::Format_RGB32);
-
-    auto writer = std::make_unique<Writer>();
-    bool ok = writer->begin(opaque.width(), opaque.height(), bitmapColours, quality);
-    for (int y = 0; ok && y < opaque.height(); ++y)
-        ok = writer->line(opaque.constScanLine(y));
-    if (!ok || !writer->finish())
-        return writer->failure();
-    return writer->takeBytes();
+    const QImage image = onWhite(picture).image();
+    JpegWriter writer({image.width(), image.height()}, quality, JpegWriter::Input::Pixels);
+    for (int y = 0; y < image.height(); ++y)
+        writer.line(image.constScanLine(y));
+    return writer.finish();
 }
 
 } // namespace lumora

@@ -6,10 +6,12 @@
 #include "imaging/JpegWriter.h"
 #include "imaging/OtherPictures.h"
 #include "imaging/PictureInput.h"
+#include "imaging/Resample.h"
 
 #include <algorithm>
 #include <atomic>
 #include <functional>
+#include <new>
 #include <optional>
 #include <thread>
 
@@ -17,34 +19,29 @@ namespace lumora {
 
 namespace {
 
-// The strongest scaled decode that still leaves at least twice the pixels wanted: nearer than that, quality suffers.
-int decodeDenominator(PictureSize source, PictureSize wanted) {
-    int denominator = 8;
-    while (denominator > 1 &&
-           (source.width < wanted.width * 2 * denominator || source.height < wanted.height * 2 * denominator))
-        denominator /= 2;
-    return denominator;
+Failure memoryIsShort(const std::filesystem::path& path) {
+    return pictureFailure(path, Failure::Kind::TooLarge, QStringLiteral("memory is short"));
 }
 
-Result<Bitmap> scaledFrom(PictureInput input, const std::function<PictureSize(PictureSize)>& wantedFor) {
-    const auto shrink = [](const Bitmap& whole, PictureSize wanted) {
-        return Bitmap(
-            whole.image().scaled(wanted.width, wanted.height, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
-    };
-    if (input.format() != PictureInput::Format::Jpeg) {
-        auto whole = readOtherPicture(input);
-        if (!whole)
-            return whole.failure();
-        return shrink(*whole, wantedFor({whole->width(), whole->height()}));
+using SizeRule = std::function<PictureSize(PictureSize)>;
+
+Result<Bitmap> loadScaled(const std::filesystem::path& path, const SizeRule& wantedFor) try {
+    auto input = PictureInput::open(path);
+    if (!input)
+        return input.failure();
+    if (input->format() == PictureInput::Format::Jpeg) {
+        auto reader = JpegReader::open(std::move(*input));
+        return reader ? readResampled(**reader, wantedFor((*reader)->size())) : reader.failure();
     }
-    auto reader = JpegReader::open(std::move(input));
-    if (!reader)
-        return reader.failure();
-    const PictureSize wanted = wantedFor((*reader)->size());
-    auto decoded = (*reader)->readBitmap(decodeDenominator((*reader)->size(), wanted));
-    if (!decoded)
-        return decoded.failure();
-    return shrink(*decoded, wanted);
+    auto whole = readOtherPicture(*input);
+    if (!whole)
+        return whole.failure();
+    Bitmap scaled = resampled(*whole, wantedFor({whole->width(), whole->height()}));
+    if (scaled.isNull())
+        return memoryIsShort(path);
+    return scaled;
+} catch (const std::bad_alloc&) {
+    return memoryIsShort(path);
 }
 
 } // namespace
@@ -74,12 +71,9 @@ Result<Bitmap> loadPicture(const std::filesystem::path& path) {
 }
 
 Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize size) {
-    auto input = PictureInput::open(path);
-    if (!input)
-        return input.failure();
     if (auto bounds = checkPictureBounds(path, size.width, size.height); !bounds)
         return bounds.failure();
-    return scaledFrom(std::move(*input), [size](PictureSize) { return size; });
+    return loadScaled(path, [size](PictureSize) { return size; });
 }
 
 PictureSize smallPictureSize(PictureSize picture, int cell) {
@@ -95,12 +89,7 @@ std::vector<Result<Bitmap>> loadSmallPictures(const std::vector<std::filesystem:
     std::atomic<std::size_t> next{0};
     const auto work = [&] {
         for (std::size_t i = next++; i < paths.size(); i = next++) {
-            auto input = PictureInput::open(paths[i]);
-            if (!input)
-                loaded[i].emplace(input.failure());
-            else
-                loaded[i].emplace(
-                    scaledFrom(std::move(*input), [cell](PictureSize size) { return smallPictureSize(size, cell); }));
+            loaded[i].emplace(loadScaled(paths[i], [cell](PictureSize size) { return smallPictureSize(size, cell); }));
         }
     };
     {
@@ -128,11 +117,23 @@ Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, 
     return writeWholeFile(path, *bytes);
 }
 
-Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality) {
-    auto scaled = loadPictureScaled(source, size);
-    if (!scaled)
-        return scaled.failure();
-    return writeJpeg(*scaled, quality);
+Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality) try {
+    if (auto bounds = checkPictureBounds(source, size.width, size.height); !bounds)
+        return bounds.failure();
+    auto input = PictureInput::open(source);
+    if (!input)
+        return input.failure();
+    if (input->format() == PictureInput::Format::Jpeg) {
+        auto reader = JpegReader::open(std::move(*input));
+        return reader ? readResampledToJpeg(**reader, size, quality) : reader.failure();
+    }
+    auto whole = readOtherPicture(*input);
+    if (!whole)
+        return whole.failure();
+    const Bitmap scaled = resampled(onWhite(*whole), size);
+    return scaled.isNull() ? memoryIsShort(source) : writeJpeg(scaled, quality);
+} catch (const std::bad_alloc&) {
+    return memoryIsShort(source);
 }
 
 Result<void> scalePictureFile(const std::filesystem::path& source, const std::filesystem::path& target,

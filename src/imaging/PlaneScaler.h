@@ -1,0 +1,99 @@
+#pragma once
+
+#include "imaging/ResampleKernels.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <new>
+#include <vector>
+
+namespace lumora {
+
+// Weights of an antialiased bicubic (a = -0.5, the kernel widened by the shrink): 14 fraction bits, and the weights of
+// a target sample sum to exactly 16384, so that a flat picture stays flat to the last bit. Beyond its ends the source
+// repeats its edge.
+struct CubicWeights {
+    int taps = 0;                      // the same for each target sample
+    std::vector<std::int32_t> first;   // source sample of the first weight
+    std::vector<std::int16_t> weights; // taps for each target sample
+
+    // step is the distance of two target samples in source samples. The centre of sample k lies at k + 0.5 in both.
+    static CubicWeights make(int sourceCount, int targetCount, double step);
+};
+
+// Zeroed memory for samples, aligned for vector loads.
+template <class Sample>
+class SampleBuffer {
+public:
+    explicit SampleBuffer(std::size_t count)
+        : m_data(static_cast<Sample*>(::operator new(count * sizeof(Sample), alignment))) {
+        std::uninitialized_value_construct_n(m_data.get(), count);
+    }
+    Sample* data() { return m_data.get(); }
+    const Sample* data() const { return m_data.get(); }
+
+private:
+    static constexpr std::align_val_t alignment{64};
+    struct Free {
+        void operator()(Sample* data) const { ::operator delete(data, alignment); }
+    };
+    std::unique_ptr<Sample, Free> m_data;
+};
+
+// One direction of a plane.
+struct PlaneAxis {
+    int source = 0; // samples that carry the picture, without padding
+    int target = 0;
+    double step = 1; // distance of two target samples in source samples
+};
+
+// Scales one plane of bytes while its rows come in from the top; holds only the rows that are still needed.
+class PlaneScaler {
+public:
+    // rowsAtOnce: how many rows the giver writes before it calls rowsReady. rowBytes: how far it writes in a row.
+    PlaneScaler(PlaneAxis across, PlaneAxis down, int rowsAtOnce, int rowBytes,
+                const ResampleKernels& kernels = bestKernels());
+
+    // Where row y is to be written; y may pass the end of the picture by padding.
+    std::uint8_t* inputRow(int y) { return m_input.data() + (y % m_inputRows) * m_inputStride; }
+    // All rows above end are written.
+    void rowsReady(int end);
+
+    // Rows of the target below this one are ready. A row is padded by its last sample to a multiple of 8.
+    int outputEnd() const { return m_outputEnd; }
+    // Not before release(y) and not from outputEnd() on.
+    std::uint8_t* outputRow(int y) { return m_output.data() + (y - m_outputBegin) * m_outputStride; }
+    // Rows below y are not asked for again.
+    void release(int y);
+
+private:
+    void finishBlock(int rows);
+
+    const ResampleKernels& m_kernels;
+    PlaneAxis m_across;
+    PlaneAxis m_down;
+
+    CubicWeights m_rowWeights;
+    std::vector<std::int32_t> m_firstPair;
+    std::vector<std::int16_t> m_pairWeights;
+    int m_pairs = 0;
+    int m_outputCount = 0; // target samples of a row, rounded up to 8
+
+    int m_inputRows = 0;
+    std::ptrdiff_t m_inputStride = 0;
+    SampleBuffer<std::uint8_t> m_input;
+    std::vector<const std::uint8_t*> m_taps;
+
+    std::ptrdiff_t m_blendedStride = 0;
+    SampleBuffer<std::int16_t> m_blended;
+    int m_blendedRows = 0;
+    SampleBuffer<std::int16_t> m_columns;
+
+    std::ptrdiff_t m_outputStride = 0;
+    std::vector<std::uint8_t> m_output;
+    int m_outputBegin = 0;
+    int m_outputEnd = 0;
+};
+
+} // namespace lumora

@@ -1,0 +1,213 @@
+#include "imaging/Resample.h"
+
+#include "imaging/ColourPlanes.h"
+#include "imaging/JpegWriter.h"
+#include "imaging/PlaneScaler.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace lumora {
+
+namespace {
+
+PlaneAxis axis(int samples, double pitch, int sourceSize, int targetSize, int targetPitch) {
+    const double step = static_cast<double>(targetPitch) * sourceSize / targetSize / pitch;
+    return {samples, (targetSize + targetPitch - 1) / targetPitch, step};
+}
+
+// A scaler for each plane; what becomes of the rows is for those who derive from it.
+class ScalingTaker : public PlaneTaker {
+public:
+    ScalingTaker(PictureSize source, PictureSize target, int chromaPitch, const ResampleKernels& kernels)
+        : m_source(source)
+        , m_target(target)
+        , m_chromaPitch(chromaPitch)
+        , m_kernels(kernels) {}
+
+    void begin(const std::vector<PlaneLayout>& planes) override {
+        m_planes = planes;
+        m_written.assign(planes.size(), 0);
+        m_scalers.reserve(planes.size());
+        for (const PlaneLayout& plane : planes) {
+            const int pitch = m_scalers.empty() ? 1 : m_chromaPitch;
+            m_scalers.emplace_back(axis(plane.width, plane.pitchX, m_source.width, m_target.width, pitch),
+                                   axis(plane.height, plane.pitchY, m_source.height, m_target.height, pitch),
+                                   plane.rowsAtOnce, plane.rowBytes, m_kernels);
+        }
+    }
+    unsigned char* row(int plane, int y) override { return m_scalers[static_cast<std::size_t>(plane)].inputRow(y); }
+    void rowsReady() override {
+        for (std::size_t i = 0; i < m_planes.size(); ++i) {
+            m_written[i] += m_planes[i].rowsAtOnce;
+            m_scalers[i].rowsReady(m_written[i]);
+        }
+        rowsScaled();
+    }
+
+protected:
+    // More rows of each of scalers() may be ready; the last call comes when all are.
+    virtual void rowsScaled() = 0;
+    std::vector<PlaneScaler>& scalers() { return m_scalers; }
+    PictureSize target() const { return m_target; }
+
+private:
+    PictureSize m_source;
+    PictureSize m_target;
+    int m_chromaPitch;
+    const ResampleKernels& m_kernels;
+    std::vector<PlaneLayout> m_planes;
+    std::vector<int> m_written;
+    std::vector<PlaneScaler> m_scalers;
+};
+
+class BitmapTaker : public ScalingTaker {
+public:
+    BitmapTaker(PictureSize source, Bitmap& target, const ResampleKernels& kernels)
+        : ScalingTaker(source, {target.width(), target.height()}, 1, kernels)
+        , m_bitmap(target)
+        , m_neutral(static_cast<std::size_t>(target.width()), 128) {}
+
+private:
+    void rowsScaled() override {
+        int end = target().height;
+        for (const PlaneScaler& scaler : scalers())
+            end = std::min(end, scaler.outputEnd());
+        const bool grey = scalers().size() < 3;
+        for (; m_next < end; ++m_next) {
+            pixelsOf(scalers()[0].outputRow(m_next), grey ? m_neutral.data() : scalers()[1].outputRow(m_next),
+                     grey ? m_neutral.data() : scalers()[2].outputRow(m_next), target().width,
+                     reinterpret_cast<QRgb*>(m_bitmap.image().scanLine(m_next)));
+        }
+        for (PlaneScaler& scaler : scalers())
+            scaler.release(m_next);
+    }
+
+    Bitmap& m_bitmap;
+    std::vector<unsigned char> m_neutral;
+    int m_next = 0;
+};
+
+class JpegTaker : public ScalingTaker {
+public:
+    JpegTaker(PictureSize source, PictureSize target, JpegWriter& writer, const ResampleKernels& kernels)
+        : ScalingTaker(source, target, 2, kernels)
+        , m_writer(writer)
+        , m_neutral(static_cast<std::size_t>(target.width) / 2 + ResampleKernels::slack, 128) {}
+
+private:
+    void rowsScaled() override {
+        const int height = target().height;
+        while (m_next < height) {
+            const int chroma = m_next / 2;
+            if (scalers()[0].outputEnd() < std::min(m_next + JpegWriter::lumaRows, height))
+                return;
+            for (std::size_t i = 1; i < scalers().size(); ++i) {
+                if (scalers()[i].outputEnd() < std::min(chroma + JpegWriter::chromaRows, (height + 1) / 2))
+                    return;
+            }
+            JpegWriter::PlaneRows rows{};
+            for (int y = 0; y < JpegWriter::lumaRows; ++y)
+                rows.luma[static_cast<std::size_t>(y)] = scalers()[0].outputRow(std::min(m_next + y, height - 1));
+            for (int y = 0; y < JpegWriter::chromaRows; ++y) {
+                const int at = std::min(chroma + y, (height + 1) / 2 - 1);
+                rows.cb[static_cast<std::size_t>(y)] =
+                    scalers().size() < 3 ? m_neutral.data() : scalers()[1].outputRow(at);
+                rows.cr[static_cast<std::size_t>(y)] =
+                    scalers().size() < 3 ? m_neutral.data() : scalers()[2].outputRow(at);
+            }
+            m_writer.planeRows(rows);
+            m_next += JpegWriter::lumaRows;
+            scalers()[0].release(m_next);
+            for (std::size_t i = 1; i < scalers().size(); ++i)
+                scalers()[i].release(m_next / 2);
+        }
+    }
+
+    JpegWriter& m_writer;
+    std::vector<unsigned char> m_neutral;
+    int m_next = 0;
+};
+
+} // namespace
+
+Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels) {
+    if (picture.isNull() || size.width < 1 || size.height < 1)
+        return {};
+    const bool transparent = picture.image().hasAlphaChannel();
+    const QImage source =
+        picture.image().convertToFormat(transparent ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
+    QImage target(size.width, size.height, source.format());
+    if (source.isNull() || target.isNull())
+        return {};
+
+    const PlaneAxis across = axis(source.width(), 1, source.width(), size.width, 1);
+    const PlaneAxis down = axis(source.height(), 1, source.height(), size.height, 1);
+    const int channels = transparent ? 4 : 3;
+    std::vector<PlaneScaler> scalers;
+    scalers.reserve(4);
+    for (int i = 0; i < channels; ++i)
+        scalers.emplace_back(across, down, 1, source.width(), kernels);
+    int next = 0;
+    for (int y = 0; y < source.height(); ++y) {
+        const auto* line = reinterpret_cast<const QRgb*>(source.constScanLine(y));
+        int end = size.height;
+        for (int i = 0; i < channels; ++i) {
+            auto* row = scalers[static_cast<std::size_t>(i)].inputRow(y);
+            for (int x = 0; x < source.width(); ++x)
+                row[x] = static_cast<unsigned char>(line[x] >> (8 * i));
+            scalers[static_cast<std::size_t>(i)].rowsReady(y + 1);
+            end = std::min(end, scalers[static_cast<std::size_t>(i)].outputEnd());
+        }
+        for (; next < end; ++next) {
+            auto* out = reinterpret_cast<QRgb*>(target.scanLine(next));
+            const auto* b = scalers[0].outputRow(next);
+            const auto* g = scalers[1].outputRow(next);
+            const auto* r = scalers[2].outputRow(next);
+            const auto* a = transparent ? scalers[3].outputRow(next) : nullptr;
+            for (int x = 0; x < size.width; ++x) {
+                // The curve overshoots at edges; a colour never lies above its alpha.
+                const int alpha = a != nullptr ? a[x] : 255;
+                out[x] =
+                    qRgba(std::min<int>(r[x], alpha), std::min<int>(g[x], alpha), std::min<int>(b[x], alpha), alpha);
+            }
+        }
+        for (PlaneScaler& scaler : scalers)
+            scaler.release(next);
+    }
+    return Bitmap(std::move(target));
+}
+
+int decodeDenominator(PictureSize source, PictureSize wanted) {
+    int denominator = 8;
+    while (denominator > 1 &&
+           (source.width / denominator < wanted.width * 2LL || source.height / denominator < wanted.height * 2LL))
+        denominator /= 2;
+    return denominator;
+}
+
+Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels) {
+    const int denominator = decodeDenominator(reader.size(), size);
+    if (!reader.hasPlanes()) {
+        auto whole = reader.readBitmap(denominator);
+        return whole ? Result<Bitmap>(resampled(*whole, size, kernels)) : whole;
+    }
+    Bitmap target(size.width, size.height, Qt::white);
+    if (target.isNull())
+        return Failure{Failure::Kind::TooLarge, QStringLiteral("memory is short")};
+    BitmapTaker taker(reader.size(), target, kernels);
+    if (auto read = reader.readPlanes(denominator, taker); !read)
+        return read.failure();
+    return target;
+}
+
+Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
+                                       const ResampleKernels& kernels) {
+    JpegWriter writer(size, quality, JpegWriter::Input::Planes);
+    JpegTaker taker(reader.size(), size, writer, kernels);
+    if (auto read = reader.readPlanes(decodeDenominator(reader.size(), size), taker); !read)
+        return read.failure();
+    return writer.finish();
+}
+
+} // namespace lumora

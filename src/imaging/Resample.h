@@ -1,0 +1,28 @@
+#pragma once
+
+#include "common/Result.h"
+#include "imaging/Bitmap.h"
+#include "imaging/JpegReader.h"
+#include "imaging/PictureFile.h"
+#include "imaging/ResampleKernels.h"
+
+#include <QByteArray>
+
+// Scaling by the antialiased bicubic of PlaneScaler. Pixel centres lie at k + 0.5, the source repeats its edge, a flat
+// picture stays flat to the last bit.
+namespace lumora {
+
+// Null when the picture is, when a side of size is under 1, or when memory is short.
+Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels = bestKernels());
+
+// The strongest scaled decode (1, 2, 4 or 8) that still leaves at least twice the pixels wanted: nearer than that,
+// quality suffers.
+int decodeDenominator(PictureSize source, PictureSize wanted);
+
+// The reader's picture in size; from plane to plane, without whole pixels, where the file allows it. The reader is used
+// up.
+Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels = bestKernels());
+Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
+                                       const ResampleKernels& kernels = bestKernels());
+
+} // namespace lumora
