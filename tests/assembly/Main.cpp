@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-// The order's summary is drawn as a picture, and fonts need an application.
+// The order sheet draws text, and fonts need an application.
 int main(int argc, char** argv) {
     ::testing::InitGoogleTest(&argc, argv);
     QGuiApplication application(argc, argv);

@@ -1,0 +1,79 @@
+#include "assembly/OrderCheck.h"
+
+#include "PlainOrder.h"
+
+namespace lumora {
+namespace {
+
+class CheckingAnOrder : public PreparingAPlainOrder {
+protected:
+    CheckingAnOrder() {
+        const QString bad = giveFile(QStringLiteral("bad.jpg"), "no picture");
+        openWith({line(givePicture(QStringLiteral("תמונה 01.jpg")), QStringLiteral("12")), line(bad),
+                  line(givePicture(QStringLiteral("ajpg"))), line(givePicture(QStringLiteral("two.jpg")))})
+            .Command6_Click();
+    }
+
+    QStringList faults() const {
+        const Result<OrderReport> report =
+            checkOrderFolder(*machine.drives.toHost(folder()), PrintFileShape::of(state.profile));
+        return report ? report->faults : QStringList(report.failure().message);
+    }
+    // The faults after a change to a file of the folder; the file is put back.
+    QStringList faultsWith(const QString& name, const std::function<void(QByteArray&)>& change) const {
+        const QString path = folder() + u'\\' + name;
+        const QByteArray before = *machine.files.read(path);
+        QByteArray changed = before;
+        change(changed);
+        EXPECT_TRUE(machine.files.writeWhole(path, changed));
+        const QStringList found = faults();
+        EXPECT_TRUE(machine.files.writeWhole(path, before));
+        return found;
+    }
+
+    const QString two = QStringLiteral("1 1015GNB0003_0174776F.jpp");
+    const QString log = QStringLiteral("2026_11_21_KUP_1234^105.txt");
+};
+
+TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
+    const Result<OrderReport> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
+    ASSERT_TRUE(report);
+    EXPECT_EQ(report->faults, QStringList());
+    EXPECT_EQ(report->order, QStringLiteral("2026_11_21_KUP_1234^105"));
+    EXPECT_EQ(report->items, 4);
+    EXPECT_EQ(report->prints, 2);
+    EXPECT_EQ(report->failed, 1);
+    EXPECT_EQ(report->copies, 15);
+}
+
+TEST_F(CheckingAnOrder, namesTheFileAtFault) {
+    const auto oneFault = [](const QStringList& faults, const QString& about) {
+        EXPECT_EQ(faults.size(), 1) << faults.join(u'|').toStdString();
+        EXPECT_TRUE(faults.join(u'|').contains(about)) << faults.join(u'|').toStdString();
+    };
+    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.chop(1); }), two);
+    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.replace("Dana", "Dora"); }), QStringLiteral("Dora"));
+    oneFault(faultsWith(QStringLiteral("!105_1234.jpp"), [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }),
+             QStringLiteral("!105_1234.jpp"));
+    oneFault(
+        faultsWith(log, [](QByteArray& bytes) { bytes.replace("fail_\",\"C:\\pics\\bad", "fail_\",\"C:\\pics\\bed"); }),
+        QStringLiteral("bad.jpg"));
+    EXPECT_EQ(
+        faultsWith(log, [](QByteArray& bytes) { bytes.replace("\"Shemot.TotalPics\",15", "\"Shemot.TotalPics\",16"); })
+            .size(),
+        3)
+        << "the total and the tails of both print files";
+    // A print file whose picture is cut short still falls into its pieces.
+    const QByteArray tail = readPrintFile(*machine.files.read(folder() + u'\\' + two), {56, 30})->tail;
+    QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);
+    picture.chop(picture.size() / 2);
+    oneFault(faultsWith(two, [&](QByteArray& bytes) { bytes = *packPrintFile(picture, {56, 30}, tail); }), two);
+
+    ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + two));
+    oneFault(faults(), QStringLiteral("two.jpg"));
+    ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + log));
+    oneFault(faults(), QStringLiteral("no order log"));
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,160 @@
+#include "assembly/OrderSheet.h"
+
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <QPainter>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+QStringList linesOf(SessionState& state) {
+    return plainSheetLines(state, FixedClock().now());
+}
+
+SessionState sessionOfTheExample() {
+    SessionState state;
+    state.shemot.n1 = QStringLiteral("Dana Levi");
+    state.shemot.n2 = QStringLiteral("03-1234567");
+    state.shemot.n3 = QStringLiteral("Herzl 1");
+    state.shemot.ppr = QStringLiteral("10/15");
+    state.shemot.maat = QStringLiteral("Matte");
+    state.shemot.FillFit = QStringLiteral("FIT");
+    state.shemot.Bord = QStringLiteral("NB");
+    state.shemot.Mail = QStringLiteral("dana@example.com");
+    state.shemot.Hearot = QStringLiteral("gift - ");
+    state.shemot.Girsa = QStringLiteral("4.00");
+    state.shemot.TotalPics = 13;
+    state.MisparHazmana = QStringLiteral("105");
+    state.shemot.ser = QStringLiteral("1234");
+    return state;
+}
+
+TEST(OrderSheet, tellsTheOrderInSixLines) {
+    SessionState state = sessionOfTheExample();
+    EXPECT_EQ(linesOf(state), QStringList({
+                                  QStringLiteral("No.....105_1234    21/11/2026 14:05:09      ver: 4.00"),
+                                  QStringLiteral("  Name....Dana Levi        Tel.....03-1234567      "),
+                                  QStringLiteral("    Herzl 1      "),
+                                  QStringLiteral("  Paper size....10/15       paper  KindMatte    FIT"),
+                                  QStringLiteral("  Total pictures...13   Border=  NB   Mail  dana@example.com"),
+                                  QStringLiteral("gift - "),
+                              }));
+    state.shemot.ppr = QStringLiteral("zz/zz");
+    state.shemot.Soog1 = QStringLiteral("one");
+    state.shemot.Soog2 = QStringLiteral("two");
+    EXPECT_EQ(linesOf(state)[3], QStringLiteral("zz/zz   paper  Kindtwo one"));
+    EXPECT_EQ(orderSheetBackground(SheetKind::Plain, state), QColor(255, 192, 255));
+    state.KodMishloach = QStringLiteral("HOM");
+    EXPECT_FALSE(linesOf(state)[0].contains(QStringLiteral("קבלת")));
+    state.KodMishloach = QStringLiteral("LOB");
+    EXPECT_TRUE(linesOf(state)[0].contains(QStringLiteral("קבלת תמונות")));
+}
+
+TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
+    SessionState state = sessionOfTheExample();
+    state.album.ShemErooa = QStringLiteral("Wedding");
+    for (std::size_t i = 0; i < state.album.Tosafot2.size(); ++i)
+        state.album.Tosafot2[i] = QString::number(i);
+    state.album.KamutHorim = QStringLiteral("2");
+    state.album.SoogHorim = QStringLiteral("30/60");
+    const QStringList lines = albumSheetLines(state, FixedClock().now());
+    EXPECT_EQ(lines.size(), 17) << "the event and the address share a line";
+    EXPECT_EQ(lines[2], QStringLiteral("  ShemErooa....Wedding    Herzl 1      "));
+    EXPECT_EQ(lines[5], QString(89, u'-'));
+    EXPECT_EQ(lines[9], QStringLiteral(" 0       1       2       3  "));
+    EXPECT_EQ(lines[10], QStringLiteral(" 4       5       6       7       8     "));
+    EXPECT_EQ(lines[12], QStringLiteral(" 2  אלבום הורים  "));
+    EXPECT_EQ(lines[13], QStringLiteral("   סוג  אלבום  הורים  30/60   "));
+    EXPECT_EQ(orderSheetBackground(SheetKind::Album, state), QColor(220, 220, 150));
+}
+
+TEST(OrderSheet, growsWithTheOrder) {
+    struct Case {
+        int items;
+        PictureSize plain, edited;
+    };
+    for (const Case& c :
+         {Case{1, {500, 480}, {450, 580}}, Case{10, {500, 480}, {450, 580}}, Case{11, {500, 880}, {450, 880}},
+          Case{50, {500, 880}, {450, 880}}, Case{51, {660, 880}, {660, 880}}, Case{100, {750, 1000}, {750, 1000}},
+          Case{101, {900, 1000}, {900, 1000}}, Case{200, {900, 1000}, {900, 1000}},
+          Case{201, {1100, 1300}, {1100, 1300}}, Case{5000, {1100, 1300}, {1100, 1300}}}) {
+        EXPECT_EQ(orderSheetSize(SheetKind::Plain, c.items), c.plain) << c.items;
+        EXPECT_EQ(orderSheetSize(SheetKind::Edited, c.items), c.edited) << c.items;
+    }
+    EXPECT_EQ(OrderSheet(SheetKind::Edited, {450, 580}, Qt::white).capacity(), 24) << "six rows of four";
+}
+
+class ContactSheet : public ::testing::Test {
+protected:
+    // The left half red, the right half blue.
+    SheetCell picture(const char* name, int width, int height) {
+        Bitmap bitmap(width, height, Qt::blue);
+        QPainter(&bitmap.image()).fillRect(0, 0, width / 2, height, Qt::red);
+        const auto path = std::filesystem::path(folder.path().toStdString()) / name;
+        EXPECT_TRUE(saveJpeg(bitmap, path, 100));
+        return {path, QString::fromLatin1(name)};
+    }
+    static bool isRed(QColor colour) { return colour.red() > 200 && colour.blue() < 60; }
+    static bool isBlue(QColor colour) { return colour.blue() > 200 && colour.red() < 60; }
+
+    QTemporaryDir folder;
+};
+
+TEST_F(ContactSheet, laysEveryPictureInLandscapeATurnedOneClockwise) {
+    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
+    const std::vector<SheetCell> cells = {picture("land", 400, 300), picture("port", 300, 400),
+                                          picture("square", 200, 200)};
+    sheet.drawContactSheet(cells, [](int) { return true; });
+    const QImage& image = sheet.bitmap().image();
+    // The first row lies at 81 + 80, cells every 82 pixels from 5.
+    EXPECT_TRUE(isRed(image.pixelColor(5 + 10, 161 + 30)));
+    EXPECT_TRUE(isBlue(image.pixelColor(5 + 70, 161 + 30)));
+    EXPECT_EQ(image.pixelColor(5 + 10, 160), QColor(Qt::white));
+    EXPECT_TRUE(isRed(image.pixelColor(87 + 40, 161 + 10))) << "the left side of a portrait picture comes to the top";
+    EXPECT_TRUE(isBlue(image.pixelColor(87 + 40, 161 + 50)));
+    EXPECT_TRUE(isRed(image.pixelColor(169 + 40, 161 + 10))) << "a square picture is turned too";
+    EXPECT_TRUE(isBlue(image.pixelColor(169 + 40, 161 + 70)));
+}
+
+TEST_F(ContactSheet, leavesTheCellOfAnUnreadablePictureEmptyAndGoesOn) {
+    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
+    sheet.drawContactSheet(
+        {{std::filesystem::path("/nowhere.jpg"), QStringLiteral("12_gone")}, picture("land", 400, 300)},
+        [](int) { return true; });
+    const QImage& image = sheet.bitmap().image();
+    EXPECT_EQ(image.copy(5, 161, 80, 80), OrderSheet(SheetKind::Plain, {80, 80}, Qt::white).bitmap().image());
+    EXPECT_TRUE(isRed(image.pixelColor(87 + 10, 161 + 30)));
+}
+
+TEST_F(ContactSheet, endsWithItsLastCellAndWhereItIsToldTo) {
+    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
+    const std::vector<SheetCell> cells(100, picture("land", 40, 30));
+    int last = -1;
+    sheet.drawContactSheet(cells, [&](int i) {
+        last = i;
+        return true;
+    });
+    EXPECT_EQ(last, sheet.capacity() - 1);
+    sheet.drawContactSheet(cells, [&](int i) {
+        last = i;
+        return i < 3;
+    });
+    EXPECT_EQ(last, 3);
+}
+
+TEST_F(ContactSheet, writesTheLinesAboveThePictures) {
+    SessionState state = sessionOfTheExample();
+    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
+    const QImage empty = sheet.bitmap().image();
+    sheet.drawLines(linesOf(state));
+    EXPECT_NE(sheet.bitmap().image().copy(0, 10, 500, 20), empty.copy(0, 10, 500, 20));
+    EXPECT_EQ(sheet.bitmap().image().copy(0, 0, 500, 8), empty.copy(0, 0, 500, 8));
+    EXPECT_EQ(sheet.bitmap().image().copy(0, 161, 500, 300), empty.copy(0, 161, 500, 300))
+        << "six lines end above the pictures";
+}
+
+} // namespace
+} // namespace lumora

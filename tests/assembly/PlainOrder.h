@@ -1,0 +1,107 @@
+#pragma once
+
+#include "assembly/Form2.h"
+#include "assembly/PrintFile.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+// A page that is only shown.
+class OtherPage : public Page {
+public:
+    using Page::Page;
+};
+
+// A picture with so much noise that its file is large for its size.
+inline Bitmap noisyPicture(int width, int height, unsigned seed) {
+    Bitmap picture(width, height, Qt::gray);
+    for (int y = 0; y < height; ++y) {
+        for (int x = 0; x < width; ++x) {
+            seed = seed * 1664525U + 1013904223U;
+            picture.image().setPixelColor(x, y, QColor((seed >> 24) & 255, (seed >> 16) & 255, (seed >> 8) & 255));
+        }
+    }
+    return picture;
+}
+
+class PreparingAPlainOrder : public ::testing::Test {
+protected:
+    PreparingAPlainOrder()
+        : chain(machine.pump) {
+        state.DiskRoot = machine.drives.programRoot();
+        state.Optint = 1;
+        state.MisparHazmana = QStringLiteral("105");
+        state.profile.JppBase = 30;
+        state.profile.JppChunks = 56;
+        state.shemot.n1 = QStringLiteral("Dana Levi");
+        state.shemot.n2 = QStringLiteral("03-1234567");
+        state.shemot.Mail = QStringLiteral("dana@example.com");
+        state.shemot.TimeOfJob = QStringLiteral("2026_11_21_KUP_1234^");
+        state.shemot.Hearot = QStringLiteral("gift - ");
+        state.shemot.ppr = QStringLiteral("10/15");
+        state.shemot.Bord = QStringLiteral("NB");
+        state.shemot.maat = QStringLiteral("מבריק");
+        state.shemot.FillFit = QStringLiteral("FIT");
+        state.shemot.ser = QStringLiteral("1234");
+        state.shemot.Girsa = QStringLiteral("4.00");
+        state.transfer.SugMishloah = 1;
+        for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
+            chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });
+        chain.registerPage(PageId::Form2, [this] { return std::make_unique<Form2>(state, machine.platform, chain); });
+        makeFolder(QStringLiteral("C:\\vedron"));
+        makeFolder(QStringLiteral("C:\\pics"));
+    }
+
+    void makeFolder(const QString& path) { std::filesystem::create_directories(*machine.drives.toHost(path)); }
+
+    QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
+        const QString path = QStringLiteral("C:\\pics\\") + name;
+        EXPECT_TRUE(machine.files.writeWhole(path, *encodeJpeg(Bitmap(width, height, colour), 92)));
+        return path;
+    }
+    QString giveFile(const QString& name, const QByteArray& bytes) {
+        const QString path = QStringLiteral("C:\\pics\\") + name;
+        EXPECT_TRUE(machine.files.writeWhole(path, bytes));
+        return path;
+    }
+
+    static QString line(const QString& path, const QString& copies = QStringLiteral("1 ")) {
+        return copies + QStringLiteral("1015GNB") + path;
+    }
+
+    Form2& openWith(const QStringList& items) {
+        state.handOver.lines = items;
+        chain.show(PageId::Form2);
+        return *dynamic_cast<Form2*>(chain.find(PageId::Form2));
+    }
+
+    QString folder(const QString& number = QStringLiteral("105")) const {
+        return QStringLiteral("C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^") + number;
+    }
+    QString logPath(const QString& number = QStringLiteral("105")) const {
+        return folder(number) + QStringLiteral("\\2026_11_21_KUP_1234^") + number + QStringLiteral(".txt");
+    }
+    QStringList printFiles(const QString& number = QStringLiteral("105")) const {
+        QStringList names = machine.files.names(folder(number), QStringLiteral("*.jpp"));
+        names.removeIf([](const QString& name) { return name.startsWith(u'!'); });
+        return names;
+    }
+    // The picture inside a print file.
+    Result<PrintFileContent> unpacked(const QString& name, const QString& number = QStringLiteral("105")) const {
+        const Result<QByteArray> bytes = machine.files.read(folder(number) + u'\\' + name);
+        return bytes ? readPrintFile(*bytes, PrintFileShape::of(state.profile))
+                     : Result<PrintFileContent>(bytes.failure());
+    }
+    PageId front() const { return chain.front()->id(); }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+};
+
+} // namespace lumora

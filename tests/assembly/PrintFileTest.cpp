@@ -1,0 +1,154 @@
+#include "assembly/PrintFile.h"
+
+#include "assembly/OrderTail.h"
+#include "assembly/PrintFileName.h"
+#include "session/SessionState.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+SessionState sessionOfTheExample() {
+    SessionState state;
+    state.shemot.n1 = QStringLiteral("Dana Levi");
+    state.shemot.n2 = QStringLiteral("03-1234567");
+    state.shemot.TotalPics = 13;
+    state.MisparHazmana = QStringLiteral("105");
+    state.shemot.ser = QStringLiteral("1234");
+    return state;
+}
+
+QByteArray someBytes(int count) {
+    QByteArray bytes;
+    for (int i = 0; i < count; ++i)
+        bytes.append(static_cast<char>(1 + (i * 7919 + i / 251) % 255));
+    return bytes;
+}
+
+TEST(PrintFile, isWrittenAsTheLabsToolsReadIt) {
+    const QByteArray tail = OrderTail::of(sessionOfTheExample()).shortForm();
+    const Result<QByteArray> file = packPrintFile("ABCDEFGHIJKLMN", {4, 30}, tail);
+    ASSERT_TRUE(file);
+    EXPECT_EQ(file->toHex().toUpper(),
+              QByteArray("414243440100454647480200494A4B4C03004D4E00000400000033342020202020202020"
+                         "31203120"
+                         "30332D31323334353637"
+                         "44616E61204C65766920"
+                         "313320"
+                         "313035"
+                         "31323334"
+                         "202020202020"));
+}
+
+TEST(PrintFile, hasTheSizeThatPieceAndRemainderGive) {
+    struct Case {
+        int length, chunks, piece, remainder, size;
+    };
+    for (const Case& c : {Case{100, 8, 12, 4, 166}, Case{10, 4, 2, 2, 68}, Case{0, 56, 0, 0, 162},
+                          Case{14, 56, 0, 14, 176}, Case{28, 56, 0, 28, 190}, Case{84, 56, 2, 28, 302},
+                          Case{112, 56, 2, 0, 274}, Case{100000, 56, 1786, 40, 100218}}) {
+        const Result<QByteArray> file = packPrintFile(someBytes(c.length), {c.chunks, 30}, QByteArray(40, ' '));
+        ASSERT_TRUE(file);
+        EXPECT_EQ(file->size(), c.size) << c.length;
+        const Result<PrintFileContent> content = readPrintFile(*file, {c.chunks, 30});
+        ASSERT_TRUE(content) << c.length;
+        EXPECT_EQ(content->piece, c.piece) << c.length;
+        EXPECT_EQ(content->remainder, c.remainder) << c.length;
+    }
+}
+
+TEST(PrintFile, givesBackEveryPictureThatDoesNotEndInZeros) {
+    for (const int chunks : {1, 2, 3, 4, 56, 57, 300}) {
+        for (const int base : {0, 30, 32767}) {
+            for (int length = 0; length < 700; length += 1 + length / 150) {
+                for (const int tailWidth : {40, 60, 0}) {
+                    const QByteArray picture = someBytes(length);
+                    const QByteArray tail = someBytes(tailWidth);
+                    const Result<QByteArray> file = packPrintFile(picture, {chunks, base}, tail);
+                    ASSERT_TRUE(file);
+                    const Result<PrintFileContent> content = readPrintFile(*file, {chunks, base});
+                    ASSERT_TRUE(content) << length << " bytes in " << chunks << " pieces, tail " << tailWidth;
+                    ASSERT_EQ(content->picture, picture)
+                        << length << " bytes in " << chunks << " pieces, tail " << tailWidth;
+                    ASSERT_EQ(content->tail, tail);
+                }
+            }
+        }
+    }
+}
+
+TEST(PrintFile, refusesWhatDoesNotHoldTogether) {
+    const QByteArray whole = *packPrintFile(someBytes(1000), {56, 30}, QByteArray(40, ' '));
+    ASSERT_TRUE(readPrintFile(whole, {56, 30}));
+    EXPECT_FALSE(readPrintFile(whole, {55, 30})) << "another number of pieces";
+    EXPECT_FALSE(readPrintFile(whole, {56, 31})) << "another base";
+    EXPECT_FALSE(readPrintFile(whole, {0, 30}));
+    EXPECT_FALSE(readPrintFile({}, {56, 30}));
+    for (qsizetype cut = 1; cut < whole.size(); cut += 12)
+        EXPECT_FALSE(readPrintFile(whole.chopped(cut), {56, 30})) << cut;
+    QByteArray number = whole;
+    number[18] = 9; // number of the first piece of 18 bytes
+    EXPECT_FALSE(readPrintFile(number, {56, 30}));
+    QByteArray marker = whole;
+    marker.replace(marker.size() - 50, 10, "9999999999");
+    EXPECT_FALSE(readPrintFile(marker, {56, 30}));
+
+    for (const int chunks : {0, -1, 32768})
+        EXPECT_FALSE(packPrintFile("x", {chunks, 30}, {})) << chunks;
+}
+
+TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
+    SessionState state = sessionOfTheExample();
+    state.shemot.n1 = QString::fromUtf8("דנה לוי-כהן\U0001F600");
+    state.shemot.n2 = QStringLiteral("+972-3-1234567");
+    state.shemot.TotalPics = 1234;
+    state.MisparHazmana = QStringLiteral("1005");
+    const QByteArray tail = OrderTail::of(state).shortForm();
+    EXPECT_EQ(tail.size(), 40);
+    const std::optional<OrderTail> read = OrderTail::parse(tail);
+    ASSERT_TRUE(read);
+    EXPECT_EQ(read->telephone, QStringLiteral("+972-3-123"));
+    EXPECT_EQ(read->name, QStringLiteral("דנה לוי-כה"));
+    EXPECT_EQ(read->totalPics, QStringLiteral("123"));
+    EXPECT_EQ(read->orderNumber, QStringLiteral("100"));
+    EXPECT_EQ(read->serial, QStringLiteral("1234"));
+
+    state.shemot.n1 = QString::fromUtf8("\U0001F600\U0001F600");
+    EXPECT_EQ(OrderTail::of(state).shortForm().size(), 40) << "a character outside the code page is one byte";
+}
+
+TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {
+    const OrderTail tail = OrderTail::of(sessionOfTheExample());
+    const QString name = QStringLiteral("a very long name of 30 letters");
+    EXPECT_EQ(tail.form(40, name), tail.shortForm());
+    EXPECT_EQ(tail.form(60, name), tail.shortForm() + "^ name of 30 letters");
+    EXPECT_EQ(tail.form(60, QStringLiteral("exactly nineteen ch")), tail.shortForm() + "^exactly nineteen ch");
+    EXPECT_EQ(tail.form(60, QStringLiteral("twentycharactersname")), tail.shortForm() + "^wentycharactersname");
+    EXPECT_EQ(tail.form(0, name), QByteArray());
+    EXPECT_EQ(OrderTail::parse(tail.form(60, QStringLiteral("תמונה")))->baseName, QStringLiteral("תמונה"));
+}
+
+TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
+    const QString base = PrintBaseName(QStringLiteral("C:\\pics\\תמונה 01.jpg"));
+    const PrintFileName name{QStringLiteral("121015MWB"), 7, 3, base};
+    EXPECT_EQ(name.text(), QStringLiteral("121015MWB0007_03FAEEE5F0E4203031.jpp"));
+    const std::optional<PrintFileName> read = PrintFileName::parse(name.text());
+    ASSERT_TRUE(read);
+    EXPECT_EQ(read->code, name.code);
+    EXPECT_EQ(read->index, 7);
+    EXPECT_EQ(read->optint, 3);
+    EXPECT_EQ(read->baseName, base);
+    EXPECT_EQ(read->copies(), 12);
+
+    EXPECT_EQ((PrintFileName{QStringLiteral("1 1015GNB"), 12345, 10, QStringLiteral("a")}.text()),
+              QStringLiteral("1 1015GNB2345_1061.jpp"));
+    EXPECT_EQ(PrintBaseName(QStringLiteral("C:\\p\\0123456789012345678901234.jpg")),
+              QStringLiteral("56789012345678901234"));
+    for (const char* other :
+         {"!105_1234.jpp", "121015MWB007_0361.jpp", "121015MWB0007_036.jpp", "121015MWB0007_03.jpp", ""})
+        EXPECT_FALSE(PrintFileName::parse(QString::fromLatin1(other))) << other;
+}
+
+} // namespace
+} // namespace lumora

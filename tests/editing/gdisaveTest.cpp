@@ -1,0 +1,118 @@
+#include "editing/gdisave.h"
+
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+class SavingPictures : public ::testing::Test {
+protected:
+    SavingPictures()
+        : chain(machine.pump) {
+        state.DiskRoot = machine.drives.programRoot();
+        state.transfer.OrderFolder = QStringLiteral("C:\\2000lumora\\!!000\\order");
+        state.MisparHazmana = QStringLiteral("105");
+        state.shemot.ser = QStringLiteral("1234");
+        std::filesystem::create_directories(*machine.drives.toHost(state.transfer.OrderFolder));
+        chain.registerPage(PageId::gdisave, [this] {
+            auto page = std::make_unique<gdisave>(state, machine.platform, chain, [this] { return startStatus; });
+            page->PicPic = Bitmap(20, 10, Qt::red);
+            page->LitlPic = Bitmap(8, 6, Qt::blue);
+            return page;
+        });
+    }
+
+    gdisave& page() { return dynamic_cast<gdisave&>(chain.load(PageId::gdisave)); }
+    bool isPicture(const QString& path, PictureSize size) {
+        const Result<PictureSize> found = readPictureSize(*machine.drives.toHost(path));
+        return found && *found == size;
+    }
+    static QString sheet(const char* extension) {
+        return QStringLiteral("C:\\2000lumora\\!!000\\order\\!105_1234") + QString::fromLatin1(extension);
+    }
+
+    int startStatus = 0;
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+};
+
+TEST_F(SavingPictures, eachButtonSavesItsPictureUnderItsName) {
+    page().Command5_Click();
+    page().Command7_Click();
+    EXPECT_TRUE(isPicture(QStringLiteral("C:\\2000lumora\\!!000\\^^^.jpg"), {20, 10}));
+    EXPECT_TRUE(isPicture(QStringLiteral("C:\\2000lumora\\000.jpg"), {8, 6}));
+    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
+}
+
+TEST_F(SavingPictures, theSheetsNameFollowsTheSenderAndTheStation) {
+    struct Case {
+        std::int16_t sender;
+        bool station, jpp, jpg;
+    };
+    for (const Case& c : {Case{0, false, true, false}, Case{0, true, true, true}, Case{1, false, false, true},
+                          Case{1, true, false, true}}) {
+        state.transfer.SugSheliach = c.sender;
+        state.TachanaMekomit = c.station;
+        page().Command6_Click();
+        EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), c.jpp);
+        EXPECT_EQ(isPicture(sheet(".jpg"), {20, 10}), c.jpg);
+        static_cast<void>(machine.files.removeFile(sheet(".jpp")));
+        static_cast<void>(machine.files.removeFile(sheet(".jpg")));
+    }
+}
+
+TEST_F(SavingPictures, doesNothingWhenTheDrawingDidNotStart) {
+    startStatus = 18;
+    page().Command5_Click();
+    page().Command6_Click();
+    page().Command7_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList({QStringLiteral("Gdiplus Not Initialized. GDI+ Error:18"),
+                                                     QStringLiteral("GDI+ not inizialized.")}));
+    EXPECT_EQ(machine.dialogs.titles, QStringList({QStringLiteral("GDI Error"), QStringLiteral("GDI Error")}));
+    EXPECT_TRUE(machine.files.names(QStringLiteral("C:\\2000lumora\\!!000"), QStringLiteral("*.*")).isEmpty());
+    EXPECT_TRUE(machine.files.names(QStringLiteral("C:\\2000lumora"), QStringLiteral("*.*")).isEmpty());
+}
+
+TEST_F(SavingPictures, tellsWhyAPictureCouldNotBeSavedAndGoesOn) {
+    EXPECT_FALSE(page().SaveJpeg(page().PicPic, QStringLiteral("C:\\missing\\a.jpg"), 90));
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].startsWith(QStringLiteral("File Not Found. GDI+ Error:10\n")));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(QStringLiteral("C:\\missing\\a.jpg")));
+    EXPECT_FALSE(page().SaveJpeg({}, QStringLiteral("C:\\2000lumora\\a.jpg"), 90));
+    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\a.jpg")));
+}
+
+TEST_F(SavingPictures, holdsTheQualityWithinItsRange) {
+    const auto savedAt = [this](int quality) {
+        const QString path = QStringLiteral("C:\\2000lumora\\q.jpg");
+        EXPECT_TRUE(page().SaveJpeg(page().PicPic, path, quality));
+        return *machine.files.read(path);
+    };
+    EXPECT_EQ(savedAt(150), savedAt(100));
+    EXPECT_EQ(savedAt(-5), savedAt(0));
+    EXPECT_NE(savedAt(0), savedAt(100));
+    page().HScroll1_Change(150);
+    EXPECT_EQ(page().HScroll1, 100);
+    EXPECT_EQ(page().Label1.text, QStringLiteral("איכות: 100"));
+}
+
+TEST_F(SavingPictures, knowsTheStatusTextsAndTheEncoder) {
+    EXPECT_EQ(gdisave::GdiStatusText(1), QStringLiteral("Generic Error."));
+    EXPECT_EQ(gdisave::GdiStatusText(17), QStringLiteral("Unsupported Gdiplus Version."));
+    EXPECT_EQ(gdisave::GdiStatusText(20), QStringLiteral("Property Not Supported."));
+    for (const int unknown : {21, -1, 1000})
+        EXPECT_EQ(gdisave::GdiStatusText(unknown), QStringLiteral("Unknown GDI+ Error."));
+    EXPECT_EQ(page().ShowGdiStatus(0), 0);
+    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
+    EXPECT_TRUE(gdisave::FindEncoderClsid(QStringLiteral("IMAGE/JPEG")));
+    EXPECT_FALSE(gdisave::FindEncoderClsid(QStringLiteral("image/webp")));
+}
+
+} // namespace
+} // namespace lumora
