@@ -39,6 +39,11 @@ Result<PrintFileContent> readFile(const QString& path, PrintFileShape shape) {
 int info(const QStringList& files, PrintFileShape shape) {
     int code = allWell;
     for (const QString& path : files) {
+        // The order sheet lies among the print files under the same ending.
+        if (const Result<QByteArray> bytes = readHostFile(toHostPath(path)); bytes && checkWholeJpeg(*bytes)) {
+            out() << path << "\n  a plain picture, as an order sheet is: " << bytes->size() << " bytes" << Qt::endl;
+            continue;
+        }
         const Result<PrintFileContent> content = readFile(path, shape);
         if (!content) {
             err() << content.failure().message << Qt::endl;
