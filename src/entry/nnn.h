@@ -137,16 +137,18 @@ private:
     void showStep();
     bool beginTile();
     void clearChoices();
-    void applyTiles();
+    void showProgress();
     void fillSizes();
     void afterKind();
-    void afterFit();
+    bool asksBorder() const;
+    bool asksFit() const;
     bool termsAgreed();
-    bool saveDetails();
+    bool nameGiven();
+    QString sizesPrompt() const;
+    void saveDetails();
     void focusOn(const QString& box);
     void refuse(const DetailsProblem& problem);
     void GoToSelection();
-    void GoToSelectionQuick();
     bool prepareOrder();
     void tell(const QString& hebrew, const QString& inEnglish);
 
@@ -154,7 +156,7 @@ private:
     const Platform& m_platform;
     PageChain& m_chain;
     DetailsMessages m_messages;
-    bool m_remembered = false; // the options were opened by the details from memory
+    bool m_termsHint = true; // not closed by the customer yet
     bool m_leaving = false;
 };
 

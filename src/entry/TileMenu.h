@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QString>
+
+#include <array>
+
+namespace lumora {
+
+// The menu's tiles by their index.
+enum Tile {
+    PrintTile,    // prints, with the details page
+    QuickTile,    // prints through the editor
+    SequenceTile, // prints picked in one sequence
+    NothingTile,  // a tile that the menu lets through without any change
+    MailTile,     // finished orders and mail
+    ExitTile,
+    AlbumTile,
+    RestartTile,
+    EnglishTile,
+    OtherTile, // a page of the lab's own
+    TileCount
+};
+
+// Which tiles a client sees, by its letter; a letter that is not known has the tiles of the design. Then the switches:
+// TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away.
+std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar);
+
+// The border code of Image13(i), two or three letters; empty for an index out of range.
+QString borderCode(int index);
+
+} // namespace lumora
