@@ -45,8 +45,8 @@ public:
 
 private:
     QString pathOf(const QString& line) const;
+    void addToIndex(int index) const;
     void indexAll() const;
-    void forget();
 
     LineForm m_form = LineForm::Short;
     TextList m_lines;

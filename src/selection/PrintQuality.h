@@ -23,7 +23,4 @@ QString printGradeText(PrintGrade grade, PictureSize size, bool english);
 // The large view in logical units: 300 wide for an upright or square picture, else 400; the height follows.
 PictureSize largeViewSize(PictureSize picture);
 
-// A small picture in its cell: the longer side fills it. At least one pixel a side.
-PictureSize smallPictureSize(PictureSize picture, int cell);
-
 } // namespace lumora

@@ -4,6 +4,7 @@
 #include "platform/Files.h"
 #include "selection/Basket.h"
 #include "selection/FolderPager.h"
+#include "selection/PrintQuality.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"
@@ -15,7 +16,6 @@
 namespace lumora {
 
 class PageChain;
-struct EditFields;
 struct Platform;
 struct SessionState;
 
@@ -54,7 +54,6 @@ public:
     void Image6_Click();    // opens and closes the help panel Frame2
     void Image11_Click();   // price list
     void Image17_Click();   // price list, on the closing panel
-    void PickFolderMode();
 
     // The offer of the whole folder.
     void Command24_Click();        // send all of it
@@ -184,7 +183,9 @@ public:
     Caption LblKoopon;
     Caption Label4kpn3; // the quantity of the coupon
     Caption Command7, Command8, Command10;
-    QString focus; // the control that is to take the keyboard; the view takes it once and clears it
+    // The box that takes the keyboard next; a view moves the focus when the number has changed.
+    QString focusBox;
+    int focusRequest = 0;
 
     Caption Pic4snifim; // the collection panel, above the closing panel
     std::array<Caption, 11> Command4Snif;
@@ -198,36 +199,45 @@ public:
     Caption Command20, Command21;
 
 private:
-    enum class MarkStored { No, Yes };
+    enum class Guide { None, PicturesShown, ChooseByHand };
 
     bool plain() const;
-    void PickFolder();
+    void takeFocus(const QString& box);
+    void say(const QString& hebrew, const QString& english);
+
+    void pickFolder();
     void takeFolderOf(const QString& picture);
     void showFolderOffer();
 
     void turnPage(const std::function<void()>& step);
     void ShowPage();
-    void MarkPage();
+    void FillChosenPage();
+    void drawPage();
     void clearCells();
     void markChosen();
     void drawCells();
+    void repaintStored(const QString& path);
     QString pictureToDraw(int cell) const;
     void setKeysPlain();
+    void showLarge(const QString& path);
+    void showGuide(Guide guide);
+    void showGrade();
 
-    QString composeCode(int cell);
-    QString composeCode(int copies, PaperWords words);
+    PrintCode composeCode(int copies, PaperWords words);
+    PrintCode composeCodeOfCell(int cell);
     void AddSimple(int cell);
     void AddForEditor(int cell);
     void AddWholeFolderLine(int index);
     void openInEditor(int cell);
-    void changeCopies(int cell, int copies);
+    // What plus and minus share: the copies are written to the cell and to the line.
+    void setCopies(int cell, int copies);
+    int copiesOfCell(int cell) const { return Val16(Label4[static_cast<std::size_t>(cell)].text); }
     void unpackOpen(const QString& record);
     void SumCopies();
-    void showLarge(const QString& path);
-    void showGuide(const QStringList& lines);
 
     bool couponRefuses();
     void FinishSimple();
+    void fillDomains();
     bool openClosingPanel();
     void closeFinish();
     void HandToPreparation();
@@ -236,7 +246,6 @@ private:
     bool handTo(PageId next);
     QString noteOfOrder() const;
     void ShowBranchCard();
-    void say(const QString& hebrew, const QString& english);
 
     void setBrowserTexts();
     void setClosingTexts();
@@ -255,6 +264,9 @@ private:
     bool m_picking = false;     // the file dialog is open
     bool m_promptStands = true; // Combo1 shows its prompt
     bool m_handedOver = false;
+    Guide m_guide = Guide::None;
+    PrintGrade m_grade = PrintGrade::Unmarked; // what Label6 tells, and of which size
+    PictureSize m_gradedSize;
     Bitmap m_editorPreview;
 };
 

@@ -1,0 +1,106 @@
+#include "selection/Basket.h"
+
+#include <QSet>
+
+#include <algorithm>
+#include <limits>
+
+namespace lumora {
+
+namespace {
+constexpr int shortestLine = 12;
+}
+
+QString Basket::pathOf(const QString& line) const {
+    return line.mid(BasketLine::pathColumn(m_form));
+}
+
+int Basket::FindByPath9(const QString& path) const {
+    if (m_form == LineForm::Short)
+        return FindByPath(path);
+    for (int i = 0; i < m_lines.count(); ++i) {
+        const QString& line = m_lines.items().at(i);
+        if (line.size() < shortestLine)
+            return -1;
+        if (QStringView(line).mid(PrintCode::width) == path)
+            return i;
+    }
+    return -1;
+}
+
+int Basket::FindByPath(const QString& path) const {
+    if (!m_indexed)
+        indexAll();
+    return m_byPath.value(path, -1);
+}
+
+void Basket::clear() {
+    m_lines.clear();
+    m_copies = 0;
+    m_byPath.clear();
+    m_indexed = true;
+    m_indexClosed = false;
+}
+
+void Basket::append(const QString& line) {
+    m_lines.append(line);
+    m_copies += PrintCode::copiesOf(line);
+    if (m_indexed)
+        addToIndex(m_lines.lastIndex());
+}
+
+void Basket::replaceAt(int index, const QString& line) {
+    if (index < 0 || index >= count())
+        return;
+    const QString old = m_lines.item(index);
+    m_copies += PrintCode::copiesOf(line) - PrintCode::copiesOf(old);
+    m_lines.replaceAt(index, line);
+    if (pathOf(old) != pathOf(line) || old.size() < shortestLine || line.size() < shortestLine)
+        m_indexed = false;
+}
+
+void Basket::removeAt(int index) {
+    if (index < 0 || index >= count())
+        return;
+    const QString old = m_lines.item(index);
+    m_copies -= PrintCode::copiesOf(old);
+    m_lines.removeAt(index);
+    m_indexed = false;
+}
+
+int Basket::SumCopies() const {
+    return static_cast<int>(std::min<long long>(m_copies, std::numeric_limits<std::int16_t>::max()));
+}
+
+void Basket::removeDuplicates() {
+    QSet<QString> seen;
+    for (int i = 0; i < count();) {
+        const QString rest = item(i).mid(2);
+        if (seen.contains(rest)) {
+            removeAt(i);
+        } else {
+            seen.insert(rest);
+            ++i;
+        }
+    }
+}
+
+void Basket::addToIndex(int index) const {
+    const QString& line = m_lines.items().at(index);
+    m_indexClosed = m_indexClosed || (m_form == LineForm::Short && line.size() < shortestLine);
+    if (m_indexClosed)
+        return;
+    const QString path = pathOf(line);
+    if (!m_byPath.contains(path))
+        m_byPath.insert(path, index);
+}
+
+void Basket::indexAll() const {
+    m_byPath.clear();
+    m_indexed = true;
+    m_indexClosed = false;
+    for (int i = 0; i < count(); ++i)
+        addToIndex(i);
+}
+
+} // namespace lumora

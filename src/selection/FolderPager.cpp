@@ -1,0 +1,53 @@
+#include "selection/FolderPager.h"
+
+#include "common/DrivePathText.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+QStringList FillPage(const QStringList& items, int& currentIndex, const std::function<QString(const QString&)>& read) {
+    QStringList page;
+    for (int i = 0; i < cellsOfPage; ++i) {
+        if (const QString text = read(items.value(currentIndex)); !text.isEmpty())
+            page += text;
+        if (currentIndex >= items.size() - 1)
+            break;
+        ++currentIndex;
+    }
+    return page;
+}
+
+void FolderPager::clear() {
+    m_paths.clear();
+    m_known.clear();
+}
+
+int FolderPager::addFolder(const QString& folder, const QStringList& names) {
+    const int lastBefore = m_paths.lastIndex();
+    for (const QString& name : names) {
+        if (IsInFolderList(folder + name))
+            continue;
+        const QString path = JoinDrivePath(folder, name);
+        m_paths.append(path);
+        m_known.insert(path);
+    }
+    const int added = m_paths.lastIndex() - lastBefore;
+    if (added > 0)
+        m_paths.setCurrentIndex(std::max(lastBefore, 0));
+    return added;
+}
+
+QStringList FolderPager::FillPageList() {
+    int index = m_paths.currentIndex();
+    const QStringList page = FillPage(m_paths.items(), index, [](const QString& path) { return path; });
+    m_paths.setCurrentIndex(index);
+    return page;
+}
+
+void FolderPager::PageBack() {
+    const int index = m_paths.currentIndex();
+    m_paths.setCurrentIndex(index < 2 * cellsOfPage ? 0 : index - 2 * cellsOfPage);
+}
+
+} // namespace lumora
