@@ -22,6 +22,9 @@ protected:
     Drives drives{data, u'C', {}};
     Files files{drives};
 
+    // Names that are no text are beyond the temporary folder's own removal.
+    void TearDown() override { fs::remove_all(data); }
+
     void put(const HostPath& name, const std::string& content = "x") const {
         fs::create_directories((data / name).parent_path());
         std::ofstream(data / name, std::ios::binary) << content;

@@ -1,0 +1,94 @@
+#include "platform/PocoInternet.h"
+#include "support/LabServers.h"
+#include "support/TcpRelay.h"
+
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+
+namespace lumora {
+namespace {
+
+class HttpTest : public ::testing::Test {
+protected:
+    QTemporaryDir local;
+    LabServers lab;
+    PocoInternet internet{TimeLimits{Poco::Timespan(2, 0), Poco::Timespan(0, 700'000)}};
+    HostPath target = toHostPath(local.path()) / "page";
+
+    void SetUp() override { ASSERT_TRUE(lab.running()) << lab.failure().toStdString(); }
+};
+
+TEST_F(HttpTest, SendsTheAddressAsItStands) {
+    const QString script = lab.site() + QStringLiteral("/aaaqamootreport/padd.asp");
+    const auto answer =
+        internet.fetch(script + QStringLiteral("?k1=tarvelmond&t1=a b&t3=Pratim: דנה\r\nלוי&t5=50%&t2=x#y+\"z\""));
+    ASSERT_TRUE(answer) << answer.failure().message.toStdString();
+    EXPECT_EQ(*answer, QByteArray("OK\r\n"));
+    EXPECT_EQ(lab.requests(1).value(0), QByteArray("GET /aaaqamootreport/padd.asp?k1=tarvelmond&t1=a%20b&t3=Pratim:%20"
+                                                   "\xe3\xf0\xe4%20%20\xec\xe5\xe9&t5=50%&t2=x#y+\"z\" HTTP/1.1"));
+    EXPECT_TRUE(lab.reports().value(0).startsWith("REPORT k1=tarvelmond | t1=a b | t2=x"));
+}
+
+TEST_F(HttpTest, GivesTheBodyWhateverTheStatusButDownloadsOnlyAGoodAnswer) {
+    const QString absent = lab.site() + QStringLiteral("/aaaqamootreport/padd.aspc.txt");
+    const auto page = internet.fetch(absent);
+    ASSERT_TRUE(page);
+    EXPECT_TRUE(page->contains("404"));
+    const auto refused = internet.download(absent, target);
+    ASSERT_FALSE(refused);
+    EXPECT_EQ(refused.failure().kind, Failure::Kind::Refused);
+    EXPECT_FALSE(std::filesystem::exists(target));
+    ASSERT_TRUE(internet.download(lab.site() + QStringLiteral("/aaasssppp/p.asp?t1=x&t2=true"), target));
+    QFile file(toText(target));
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    EXPECT_EQ(file.readAll(), QByteArray("OK\r\n"));
+}
+
+TEST_F(HttpTest, FailsClearlyWhereThereIsNoAnswer) {
+    const std::pair<QString, Failure::Kind> cases[] = {
+        {QStringLiteral("https://127.0.0.1/x"), Failure::Kind::Unsupported},
+        {QStringLiteral("ftp://127.0.0.1/x"), Failure::Kind::Unsupported},
+        {QStringLiteral("http:///x"), Failure::Kind::Unsupported},
+        {QString(), Failure::Kind::Unsupported},
+        {QStringLiteral("http://127.0.0.1:%1/x").arg(FreePort()), Failure::Kind::Disconnected},
+    };
+    for (const auto& [url, kind] : cases) {
+        const auto answer = internet.fetch(url);
+        ASSERT_FALSE(answer) << url.toStdString();
+        EXPECT_EQ(answer.failure().kind, kind) << answer.failure().message.toStdString();
+    }
+}
+
+TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatWasCutOrStoodStill) {
+    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
+    const QString url = QStringLiteral("http://%1/nothing").arg(relay.host());
+    relay.setFaults({.cutDataAfter = 40, .times = 1});
+    EXPECT_FALSE(internet.download(url, target));
+    relay.setFaults({.stallDataAfter = 40, .times = 1});
+    const auto stalled = internet.fetch(url);
+    ASSERT_FALSE(stalled);
+    EXPECT_EQ(stalled.failure().kind, Failure::Kind::TimedOut) << stalled.failure().message.toStdString();
+    EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
+}
+
+TEST_F(HttpTest, LetsQueuedPaintingRunButNoTimerWhileItWaits) {
+    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
+    relay.setFaults({.stallDataAfter = 0, .times = 1});
+    QObject page;
+    bool painted = false;
+    bool ticked = false;
+    QMetaObject::invokeMethod(
+        &page, [&] { painted = true; }, Qt::QueuedConnection);
+    QTimer::singleShot(50, &page, [&] { ticked = true; });
+    EXPECT_FALSE(internet.fetch(QStringLiteral("http://%1/x").arg(relay.host())));
+    EXPECT_TRUE(painted);
+    EXPECT_FALSE(ticked);
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,113 @@
+#include "support/LabServers.h"
+
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/StreamSocket.h>
+#include <Poco/Timespan.h>
+
+#include <QElapsedTimer>
+#include <QFile>
+#include <QThread>
+
+namespace lumora {
+namespace {
+
+QString script(const char* name) {
+    return QStringLiteral(LUMORA_LAB_SCRIPTS "/") + QLatin1String(name);
+}
+
+QByteArray contentOf(const HostPath& path) {
+    QFile file(toText(path));
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+QByteArrayList linesOf(const HostPath& path) {
+    QByteArrayList lines = contentOf(path).split('\n');
+    if (!lines.isEmpty() && lines.last().isEmpty())
+        lines.removeLast();
+    return lines;
+}
+
+bool answers(quint16 port) {
+    try {
+        Poco::Net::StreamSocket socket;
+        socket.connect(Poco::Net::SocketAddress("127.0.0.1", port), Poco::Timespan(1, 0));
+        return true;
+    } catch (const std::exception&) {
+        return false;
+    }
+}
+
+} // namespace
+
+quint16 FreePort() {
+    const Poco::Net::ServerSocket socket(Poco::Net::SocketAddress("127.0.0.1", 0));
+    return socket.address().port();
+}
+
+LabServers::LabServers() {
+    QProcess start;
+    start.setProcessChannelMode(QProcess::MergedChannels);
+    start.start(script("start"), {m_folder.path()});
+    if (!start.waitForFinished(60'000) || start.exitStatus() != QProcess::NormalExit || start.exitCode() != 0) {
+        m_failure =
+            QStringLiteral("the lab did not start: %1 %2").arg(start.errorString(), QString::fromUtf8(start.readAll()));
+        return;
+    }
+    for (const QByteArray& line : linesOf(folder() / "ports")) {
+        const qsizetype sign = line.indexOf('=');
+        (line.startsWith("FTP") ? m_ftpPort : m_httpPort) = line.mid(sign + 1).toUShort();
+    }
+    if (m_ftpPort == 0 || m_httpPort == 0)
+        m_failure = QStringLiteral("the lab told no ports");
+}
+
+LabServers::~LabServers() {
+    QProcess stop;
+    stop.start(script("stop"), {m_folder.path()});
+    stop.waitForFinished(20'000);
+    // Names of bytes that are no text are beyond the temporary folder's own removal.
+    std::error_code error;
+    std::filesystem::remove_all(folder(), error);
+}
+
+QByteArrayList LabServers::requests() const {
+    return linesOf(folder() / "requests.log");
+}
+
+QByteArrayList LabServers::reports() const {
+    return linesOf(folder() / "reports.log");
+}
+
+QByteArray LabServers::ftpLog() const {
+    return contentOf(folder() / "log" / "ftp.log");
+}
+
+SecondFtpServer::SecondFtpServer() {
+    m_server.setProcessChannelMode(QProcess::MergedChannels);
+    for (int attempt = 0; attempt < 3; ++attempt) {
+        m_port = FreePort();
+        // Debian's own interpreter: another python in the path would not have the module.
+        m_server.start(QStringLiteral("/usr/bin/python3"),
+                       {QStringLiteral("-m"), QStringLiteral("pyftpdlib"), QStringLiteral("-i"),
+                        QStringLiteral("127.0.0.1"), QStringLiteral("-p"), QString::number(m_port),
+                        QStringLiteral("-w"), QStringLiteral("-d"), m_folder.path(), QStringLiteral("-u"), user(),
+                        QStringLiteral("-P"), password()});
+        QElapsedTimer waiting;
+        waiting.start();
+        while (m_server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
+            if (answers(m_port))
+                return;
+            m_server.waitForFinished(20);
+        }
+    }
+    m_failure = QStringLiteral("pyftpdlib did not start: ") + QString::fromUtf8(m_server.readAll());
+}
+
+SecondFtpServer::~SecondFtpServer() {
+    if (m_server.state() != QProcess::NotRunning) {
+        m_server.kill();
+        m_server.waitForFinished(5'000);
+    }
+}
+
+} // namespace lumora

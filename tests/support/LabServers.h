@@ -1,0 +1,80 @@
+#pragma once
+
+#include "platform/HostPath.h"
+
+#include <QByteArrayList>
+#include <QProcess>
+#include <QString>
+#include <QTemporaryDir>
+
+namespace lumora {
+
+// Real servers of a lab over a temporary folder, on free ports of 127.0.0.1, ended with this object. The ordinary kind
+// is the demo's own lab: vsftpd and nginx with php-cgi. A test asserts running() and so fails, and never skips, where a
+// server could not start.
+class LabServers {
+public:
+    LabServers();
+    ~LabServers();
+    LabServers(const LabServers&) = delete;
+    LabServers& operator=(const LabServers&) = delete;
+
+    bool running() const { return m_failure.isEmpty(); }
+    QString failure() const { return m_failure; }
+
+    QString ftpHost() const { return QStringLiteral("127.0.0.1:%1").arg(m_ftpPort); }
+    quint16 ftpPort() const { return m_ftpPort; }
+    static QString user() { return QStringLiteral("ftp"); }
+    static QString password() { return QStringLiteral("loopback-lab"); }
+
+    quint16 httpPort() const { return m_httpPort; }
+    // "http://127.0.0.1:PORT", without a slash at its end.
+    QString site() const { return QStringLiteral("http://127.0.0.1:%1").arg(m_httpPort); }
+
+    // What the account sees as "/", and the folder that orders arrive in.
+    HostPath account() const { return folder() / "ftp"; }
+    HostPath ordersFolder() const { return account() / "zalamim234"; }
+    HostPath folder() const { return toHostPath(m_folder.path()); }
+    HostPath labFile() const { return folder() / "lab.ini"; }
+
+    // The request lines as the web server saw them, in order. The server writes a line when it has answered, so this
+    // waits a little while for at least so many.
+    QByteArrayList requests(int atLeast = 0) const;
+    // What the lab's scripts took from them.
+    QByteArrayList reports() const;
+    // The FTP server's log of commands and replies.
+    QByteArray ftpLog() const;
+
+private:
+    QTemporaryDir m_folder;
+    QString m_failure;
+    quint16 m_ftpPort = 0;
+    quint16 m_httpPort = 0;
+};
+
+// A second kind of FTP server, one that turns CR LF into LF under type ASCII and refuses a listing by pattern.
+class SecondFtpServer {
+public:
+    SecondFtpServer();
+    ~SecondFtpServer();
+    SecondFtpServer(const SecondFtpServer&) = delete;
+    SecondFtpServer& operator=(const SecondFtpServer&) = delete;
+
+    bool running() const { return m_failure.isEmpty(); }
+    QString failure() const { return m_failure; }
+    QString ftpHost() const { return QStringLiteral("127.0.0.1:%1").arg(m_port); }
+    static QString user() { return QStringLiteral("lumora"); }
+    static QString password() { return QStringLiteral("second-lab"); }
+    HostPath account() const { return toHostPath(m_folder.path()); }
+
+private:
+    QTemporaryDir m_folder;
+    QProcess m_server;
+    QString m_failure;
+    quint16 m_port = 0;
+};
+
+// A port of 127.0.0.1 on which nothing listens at the moment.
+quint16 FreePort();
+
+} // namespace lumora

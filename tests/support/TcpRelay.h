@@ -1,0 +1,74 @@
+#pragma once
+
+#include <QByteArray>
+#include <QByteArrayList>
+#include <QString>
+
+#include <atomic>
+#include <chrono>
+#include <list>
+#include <mutex>
+#include <thread>
+
+namespace lumora {
+
+// A bad line: stands in front of a server on 127.0.0.1, passes everything on, and makes the faults it is told to. In
+// front of an FTP server it also carries the data connections, by putting ports of its own into the answers to EPSV and
+// PASV.
+class TcpRelay {
+public:
+    enum class Kind { Ftp, Plain };
+
+    struct Faults {
+        qint64 cutDataAfter = -1;   // bytes of a data connection (Plain: of an answer), then its ends are reset
+        qint64 stallDataAfter = -1; // bytes, then nothing goes on until the relay ends
+        std::chrono::milliseconds delayReplies{0};
+        bool loseClosingReply = false; // the 226 is swallowed and the control connection reset
+        bool refuseConnections = false;
+        QByteArray command = {};   // with cutAtCommand or reply: "STOR"
+        bool cutAtCommand = false; // the control connection is reset when the command comes, which is not passed on
+        QByteArray reply = {}; // answered in place of the server, which never hears the command: "552 Quota exceeded"
+        int times = -1;        // so many faults, then a good line; -1: for ever
+    };
+
+    explicit TcpRelay(quint16 serverPort, Kind kind = Kind::Ftp);
+    ~TcpRelay();
+    TcpRelay(const TcpRelay&) = delete;
+    TcpRelay& operator=(const TcpRelay&) = delete;
+
+    quint16 port() const { return m_port; }
+    QString host() const { return QStringLiteral("127.0.0.1:%1").arg(m_port); }
+
+    // For what happens from now on.
+    void setFaults(const Faults& faults);
+    int faultsMade() const { return m_made; }
+    int connections() const { return m_connections; }
+    // The command lines that clients sent, without their line ends.
+    QByteArrayList commands() const;
+
+private:
+    void acceptLoop();
+    void control(int client);
+    void data(int listener, quint16 serverPort);
+    void pumpBytes(int client, int server);
+    // Counts a fault if one more is due.
+    bool due();
+    Faults faults() const;
+    QByteArray ownPort(const QByteArray& reply);
+    void spawn(std::thread thread);
+
+    Kind m_kind;
+    quint16 m_serverPort;
+    quint16 m_port = 0;
+    int m_listener = -1;
+    std::atomic<bool> m_stop = false;
+    std::atomic<int> m_made = 0;
+    std::atomic<int> m_connections = 0;
+    mutable std::mutex m_mutex;
+    Faults m_faults;
+    QByteArrayList m_commands;
+    std::list<std::thread> m_threads;
+    std::thread m_acceptor;
+};
+
+} // namespace lumora
