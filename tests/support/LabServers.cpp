@@ -70,8 +70,15 @@ LabServers::~LabServers() {
     std::filesystem::remove_all(folder(), error);
 }
 
-QByteArrayList LabServers::requests() const {
-    return linesOf(folder() / "requests.log");
+QByteArrayList LabServers::requests(int atLeast) const {
+    QElapsedTimer waiting;
+    waiting.start();
+    QByteArrayList lines = linesOf(folder() / "requests.log");
+    while (lines.size() < atLeast && waiting.elapsed() < 5'000) {
+        QThread::msleep(10);
+        lines = linesOf(folder() / "requests.log");
+    }
+    return lines;
 }
 
 QByteArrayList LabServers::reports() const {
