@@ -7,6 +7,7 @@
 #include "imaging/OtherPictures.h"
 #include "imaging/PictureInput.h"
 #include "imaging/Resample.h"
+#include "imaging/Stopwatch.h"
 
 #include <algorithm>
 #include <atomic>
@@ -117,7 +118,9 @@ Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, 
     return writeWholeFile(path, *bytes);
 }
 
-Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality) try {
+Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
+                                      PictureTimes* times) try {
+    Stopwatch watch(times);
     if (auto bounds = checkPictureBounds(source, size.width, size.height); !bounds)
         return bounds.failure();
     auto input = PictureInput::open(source);
@@ -125,13 +128,19 @@ Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, Pictu
         return input.failure();
     if (input->format() == PictureInput::Format::Jpeg) {
         auto reader = JpegReader::open(std::move(*input));
-        return reader ? readResampledToJpeg(**reader, size, quality) : reader.failure();
+        return reader ? readResampledToJpeg(**reader, size, quality, bestKernels(), times) : reader.failure();
     }
     auto whole = readOtherPicture(*input);
     if (!whole)
         return whole.failure();
+    watch.add(&PictureTimes::decode);
     const Bitmap scaled = resampled(onWhite(*whole), size);
-    return scaled.isNull() ? memoryIsShort(source) : writeJpeg(scaled, quality);
+    watch.add(&PictureTimes::draw);
+    if (scaled.isNull())
+        return memoryIsShort(source);
+    auto bytes = writeJpeg(scaled, quality);
+    watch.add(&PictureTimes::encode);
+    return bytes;
 } catch (const std::bad_alloc&) {
     return memoryIsShort(source);
 }

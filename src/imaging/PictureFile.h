@@ -21,6 +21,13 @@ struct PictureSize {
     bool operator==(const PictureSize&) const = default;
 };
 
+// Where the time of one picture went, in milliseconds. Its stages run interleaved, row by row.
+struct PictureTimes {
+    double decode = 0;
+    double draw = 0;
+    double encode = 0;
+};
+
 // From the header alone.
 Result<PictureSize> readPictureSize(const std::filesystem::path& path);
 
@@ -47,7 +54,8 @@ Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, 
 
 // A JPEG (or another picture) scaled to exactly size on white as the bytes of a JPEG file: what a plain print is made
 // of. It touches nothing but the source, so that the next picture of an order can be made ahead on another thread.
-Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality);
+Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
+                                      PictureTimes* times = nullptr);
 
 // The same into a file, written whole or not at all.
 Result<void> scalePictureFile(const std::filesystem::path& source, const std::filesystem::path& target,

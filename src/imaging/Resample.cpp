@@ -3,6 +3,7 @@
 #include "imaging/ColourPlanes.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/PlaneScaler.h"
+#include "imaging/Stopwatch.h"
 
 #include <algorithm>
 #include <optional>
@@ -90,10 +91,18 @@ private:
 
 class JpegTaker : public ScalingTaker {
 public:
-    JpegTaker(PictureSize source, PictureSize target, JpegWriter& writer, const ResampleKernels& kernels)
+    JpegTaker(PictureSize source, PictureSize target, JpegWriter& writer, const ResampleKernels& kernels,
+              Stopwatch& watch)
         : ScalingTaker(source, target, 2, kernels)
         , m_writer(writer)
+        , m_watch(watch)
         , m_neutral(static_cast<std::size_t>(target.width) / 2 + ResampleKernels::slack, 128) {}
+
+    void rowsReady() override {
+        m_watch.add(&PictureTimes::decode);
+        ScalingTaker::rowsReady();
+        m_watch.add(&PictureTimes::draw);
+    }
 
 private:
     void rowsScaled() override {
@@ -116,7 +125,9 @@ private:
                 rows.cr[static_cast<std::size_t>(y)] =
                     scalers().size() < 3 ? m_neutral.data() : scalers()[2].outputRow(at);
             }
+            m_watch.add(&PictureTimes::draw);
             m_writer.planeRows(rows);
+            m_watch.add(&PictureTimes::encode);
             m_next += JpegWriter::lumaRows;
             scalers()[0].release(m_next);
             for (std::size_t i = 1; i < scalers().size(); ++i)
@@ -125,6 +136,7 @@ private:
     }
 
     JpegWriter& m_writer;
+    Stopwatch& m_watch;
     std::vector<unsigned char> m_neutral;
     int m_next = 0;
 };
@@ -202,12 +214,17 @@ Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const Resampl
 }
 
 Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
-                                       const ResampleKernels& kernels) {
+                                       const ResampleKernels& kernels, PictureTimes* times) {
+    Stopwatch watch(times);
     JpegWriter writer(size, quality, JpegWriter::Input::Planes);
-    JpegTaker taker(reader.size(), size, writer, kernels);
-    if (auto read = reader.readPlanes(decodeDenominator(reader.size(), size), taker); !read)
+    JpegTaker taker(reader.size(), size, writer, kernels, watch);
+    auto read = reader.readPlanes(decodeDenominator(reader.size(), size), taker);
+    watch.add(&PictureTimes::decode);
+    if (!read)
         return read.failure();
-    return writer.finish();
+    auto bytes = writer.finish();
+    watch.add(&PictureTimes::encode);
+    return bytes;
 }
 
 } // namespace lumora

@@ -23,6 +23,6 @@ int decodeDenominator(PictureSize source, PictureSize wanted);
 // up.
 Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels = bestKernels());
 Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
-                                       const ResampleKernels& kernels = bestKernels());
+                                       const ResampleKernels& kernels = bestKernels(), PictureTimes* times = nullptr);
 
 } // namespace lumora

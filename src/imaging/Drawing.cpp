@@ -1,0 +1,48 @@
+#include "imaging/Drawing.h"
+
+#include "imaging/Resample.h"
+
+#include <QFont>
+#include <QFontDatabase>
+#include <QFontMetrics>
+#include <QPainter>
+#include <QTransform>
+
+namespace lumora {
+
+Bitmap turned(const Bitmap& picture, QuarterTurn turn) {
+    if (turn == QuarterTurn::None)
+        return picture;
+    return Bitmap(picture.image().transformed(QTransform().rotate(static_cast<int>(turn))));
+}
+
+void drawTurned(Bitmap& target, const QRect& box, const Bitmap& picture, QuarterTurn turn) {
+    const bool onItsSide = turn == QuarterTurn::Right || turn == QuarterTurn::Left;
+    const PictureSize upright =
+        onItsSide ? PictureSize{box.height(), box.width()} : PictureSize{box.width(), box.height()};
+    const Bitmap scaled = turned(resampled(picture, upright), turn);
+    if (!target.isNull() && !scaled.isNull())
+        QPainter(&target.image()).drawImage(box.topLeft(), scaled.image());
+}
+
+void drawText(Bitmap& target, const QPoint& topLeft, const QString& text, const TextStyle& style) {
+    const QString family = style.family == QStringLiteral("David") ? QStringLiteral("David CLM") : style.family;
+    if (target.isNull() || !QFontDatabase::hasFamily(family))
+        return;
+    QFont font(family);
+    font.setPixelSize(style.pixelSize);
+    font.setBold(style.bold);
+    QPainter painter(&target.image());
+    painter.setRenderHint(QPainter::TextAntialiasing);
+    painter.setLayoutDirection(Qt::LeftToRight);
+    painter.setFont(font);
+    painter.setPen(style.colour);
+    int top = topLeft.y();
+    for (QString line : text.split(u'\n')) {
+        line.remove(u'\r');
+        painter.drawText(QPoint(topLeft.x(), top + painter.fontMetrics().ascent()), line);
+        top += painter.fontMetrics().lineSpacing();
+    }
+}
+
+} // namespace lumora

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "imaging/PictureFile.h"
+
+#include <chrono>
+
+namespace lumora {
+
+// Adds the time since the last call to one stage; does nothing where nobody asked for times.
+class Stopwatch {
+public:
+    explicit Stopwatch(PictureTimes* times)
+        : m_times(times)
+        , m_since(Clock::now()) {}
+
+    void add(double PictureTimes::*stage) {
+        if (m_times == nullptr)
+            return;
+        const auto now = Clock::now();
+        m_times->*stage += std::chrono::duration<double, std::milli>(now - m_since).count();
+        m_since = now;
+    }
+
+private:
+    using Clock = std::chrono::steady_clock;
+    PictureTimes* m_times;
+    Clock::time_point m_since;
+};
+
+} // namespace lumora
