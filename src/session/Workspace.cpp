@@ -32,7 +32,8 @@ long long counterValue(const QString& line) {
 std::optional<QString> firstLine(const QByteArray& bytes) {
     if (bytes.isEmpty())
         return std::nullopt;
-    QByteArray line = bytes.left(bytes.indexOf('\n'));
+    const qsizetype end = bytes.indexOf('\n');
+    QByteArray line = end < 0 ? bytes : bytes.left(end);
     if (line.endsWith('\r'))
         line.chop(1);
     return AnsiCodePage::decode(line);

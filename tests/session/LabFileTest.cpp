@@ -1,0 +1,181 @@
+#include "session/LabFile.h"
+
+#include "session/ClientProfile.h"
+
+#include <QFile>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+LabFileReading parse(const QByteArray& bytes) {
+    return ParseLabFile(bytes, QStringLiteral("lab.ini"));
+}
+
+TEST(LabFileTest, AnEmptyFileLeavesTheDefaults) {
+    const LabFileReading reading = parse("\xEF\xBB\xBF\r\n# nothing\r\n; nothing\r\n[Server]\r\n");
+    EXPECT_TRUE(reading.errors.isEmpty()) << reading.errors.join(u'\n').toStdString();
+    EXPECT_EQ(reading.deployment.profile.FtpServer, u"192.0.2.10");
+    EXPECT_EQ(reading.deployment.profile.FtpFolder2, u"zalamim234");
+    EXPECT_EQ(reading.deployment.SugTzad, 40);
+}
+
+TEST(LabFileTest, ReadsKeysOfEverySection) {
+    const LabFileReading reading =
+        parse("[Server]\n"
+              "Host = 127.0.0.1:2121\r\n"
+              "Password = \" a;b#c=d \"\n"
+              "Folder1 = \xD7\x90\n"
+              "JppChunks=32767\n"
+              "JppTail = 60\n"
+              "[Client]\nLetter = AS\n"
+              "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
+              "[Switches]\nCoupon = YES\nQuickOrder = no\nReports = no\nDeepCompression = ask\n"
+              "[Shops]\nShop2Phone = 03-5\n"
+              "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
+              "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
+    ASSERT_TRUE(reading.errors.isEmpty()) << reading.errors.join(u'\n').toStdString();
+    const Deployment& lab = reading.deployment;
+    EXPECT_EQ(lab.profile.FtpServer, u"127.0.0.1:2121");
+    EXPECT_EQ(lab.profile.FtpPassword, u" a;b#c=d ");
+    EXPECT_EQ(lab.profile.FtpFolder1, u"א");
+    EXPECT_EQ(lab.profile.JppChunks, 32767);
+    EXPECT_EQ(lab.SugTzad, 60);
+    EXPECT_EQ(lab.profile.SizeList[1], u"20/30");
+    EXPECT_EQ(lab.profile.SizeList[2], u"");
+    EXPECT_EQ(lab.profile.QuickSizes[2], u"20/30");
+    EXPECT_EQ(lab.HaKoopon, 1);
+    EXPECT_EQ(lab.MinuyPaar, 2);
+    EXPECT_EQ(lab.profile.ReportOn, 0);
+    EXPECT_EQ(lab.MediniyutDchisa, 1);
+    EXPECT_EQ(lab.profile.Shops[1].phone, u"03-5");
+    EXPECT_EQ(lab.profile.Branches[9].caption, u"North");
+    EXPECT_EQ(lab.profile.Branches[9].address[1], u"2nd floor");
+    EXPECT_EQ(lab.profile.Branches[10].caption, u"משלוח לבית");
+    EXPECT_EQ(lab.programLetter, u'E');
+    EXPECT_EQ(lab.driveOrder, u"ZD");
+}
+
+TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
+    const struct {
+        QByteArray file;
+        QStringList told; // each stands in the one message
+    } cases[] = {
+        {"[Servers]\nHost = a\n", {"lab.ini:1:", "\"Servers\"", "[Server]", "[Drives]"}},
+        {"[Server\nHost = a\n", {"lab.ini:1:", "allowed"}},
+        {"Host = a\n", {"lab.ini:1:", "before the first [section]"}},
+        {"[Server]\nHots = a\n", {"lab.ini:2:", "\"Hots\"", "Host, User"}},
+        {"[Server]\njust words\n", {"lab.ini:2:", "key = value"}},
+        {"[Server]\nUser = a\nuser = b\n", {"lab.ini:3:", "Server.User", "line 2"}},
+        {"[Server]\nFolder2 =\n", {"lab.ini:2:", "Server.Folder2", "not empty"}},
+        {"[Server]\nFolder2 = a/b\n", {"Server.Folder2"}},
+        {"[Server]\nFolder1 = ..\n", {"Server.Folder1"}},
+        {"[Server]\nHost =\n", {"Server.Host", "host name"}},
+        {"[Server]\nHost = a b\n", {"Server.Host"}},
+        {"[Server]\nHost = a:70000\n", {"Server.Host", "65535"}},
+        {"[Server]\nJppChunks = 0\n", {"Server.JppChunks", "1 to 32767"}},
+        {"[Server]\nJppChunks = 32768\n", {"Server.JppChunks"}},
+        {"[Server]\nJppChunks = 5x\n", {"Server.JppChunks"}},
+        {"[Server]\nJppTail = 50\n", {"Server.JppTail", "40 or 60"}},
+        {"[Client]\nLetter = Q\n", {"Client.Letter", "\"Q\"", "AS, B, C"}},
+        {"[Client]\nCode = a/b\n", {"Client.Code"}},
+        {"[Lab]\nPhone = \xE6\xBC\xA2\n", {"Lab.Phone", "Windows-1255"}},
+        {"[Paper]\nSizes = 10/15, 9/13\n", {"Paper.Sizes", "two digits"}},
+        {"[Paper]\nSizes =\n", {"Paper.Sizes"}},
+        {"[Paper]\nQuickSizes = 10/15,10/15,10/15,10/15\n", {"Paper.QuickSizes", "1 to 3"}},
+        {"[Paper]\nSizes = 00/15\n", {"Paper.Sizes"}},
+        {"[Addresses]\nSite = http://a.example\n", {"Addresses.Site", "slash"}},
+        {"[Addresses]\nReport = ftp://a.example/x\n", {"Addresses.Report", "http://"}},
+        {"[Switches]\nReports = perhaps\n", {"Switches.Reports", "\"perhaps\"", "yes or no"}},
+        {"[Drives]\nOrder = EDE\n", {"Drives.Order", "once"}},
+        {"[Drives]\nProgramLetter = Z\n", {"Drives.ProgramLetter"}},
+        {"[Drives]\nDataFolder = here\n", {"Drives.DataFolder"}},
+        {"[Branches]\nBranch11 = a\n", {"\"Branch11\""}},
+        {"[Lab]\nName1 = \xFF\n", {"lab.ini:", "UTF-8"}},
+        {QByteArray(2 << 20, '#'), {"lab.ini:", "1 MiB"}},
+    };
+    for (const auto& c : cases) {
+        const QStringList errors = parse(c.file).errors;
+        ASSERT_EQ(errors.size(), 1) << c.file.left(80).toStdString() << errors.join(u'\n').toStdString();
+        for (const QString& text : c.told)
+            EXPECT_TRUE(errors[0].contains(text)) << errors[0].toStdString() << "\nlacks " << text.toStdString();
+    }
+}
+
+TEST(LabFileTest, TellsEveryFaultAtOnceAndNeverAPassword) {
+    const QByteArray file =
+        "[Server]\nPassword = secret^7\nUser = secret^7\nsecret7\nsecret-7 = 1\nHost = ftp://u:secret7@h\n"
+        "Password = secret7\n";
+    const QStringList errors = parse(file).errors;
+    EXPECT_EQ(errors.size(), 6);
+    EXPECT_FALSE(errors.join(u'\n').contains(u"secret")) << errors.join(u'\n').toStdString();
+}
+
+TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
+    const LabFileReading example = ReadLabFile(HostPath(LUMORA_SOURCE_DIR) / "packaging" / "lab.ini.example");
+    ASSERT_TRUE(example.errors.isEmpty()) << example.errors.join(u'\n').toStdString();
+    SessionState given;
+    SessionState builtIn;
+    LoadDefaultProfile(given, example.deployment);
+    LoadDefaultProfile(builtIn, Deployment());
+    const auto texts = [](const SessionState& s) {
+        const ClientProfile& p = s.profile;
+        QStringList all = {p.FtpFolder1, p.FtpFolder2, p.ClientCode,  p.FtpServer,    p.FtpPassword, p.FtpUser,
+                           p.LabName1,   p.LabName2,   p.LabMail,     p.LabPhone,     p.SiteUrl,     p.PriceListUrl,
+                           p.ReportUrl,  p.DoneUrl,    p.HttpDoneUrl, p.SettingsHost, p.ClientLetter};
+        for (const QString& size : p.SizeList)
+            all += size;
+        for (const QString& size : p.QuickSizes)
+            all += size;
+        for (const Shop& shop : p.Shops)
+            all += shop.name + shop.phone;
+        for (const int number :
+             {int(p.JppBase), p.JppChunks, int(p.ReportOn), int(s.MediniyutDchisa), int(s.GvulMuzag), int(s.FitMuzag),
+              int(s.TmunatPaar), int(s.MinuyPaar), int(s.TachanaMekomit), int(s.DoarReshut), int(s.DeliveryChoiceMode),
+              int(s.coupon.HaKoopon), int(s.transfer.SugSheliach)})
+            all += QString::number(number);
+        return all;
+    };
+    EXPECT_EQ(texts(given), texts(builtIn));
+    EXPECT_EQ(example.deployment.SugTzad, Deployment().SugTzad);
+    EXPECT_EQ(example.deployment.programLetter, Deployment().programLetter);
+}
+
+TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {
+    QTemporaryDir folder;
+    const QString name = folder.filePath(QStringLiteral("lab.ini"));
+    const auto reading = [&](const QByteArray& content, QFile::Permissions rights) {
+        QFile file(name);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
+        file.write(content);
+        file.close();
+        EXPECT_TRUE(file.setPermissions(rights));
+        return ReadLabFile(toHostPath(name));
+    };
+    const QFile::Permissions mine = QFile::ReadOwner | QFile::WriteOwner;
+    const QByteArray secret = "[Server]\nPassword = hush123\n";
+    const QStringList warnings = reading(secret, mine | QFile::ReadOther).warnings;
+    ASSERT_EQ(warnings.size(), 1);
+    EXPECT_TRUE(warnings[0].contains(name) && warnings[0].contains(u"chmod 600"));
+    EXPECT_FALSE(warnings[0].contains(u"hush123"));
+    EXPECT_TRUE(reading(secret, mine).warnings.isEmpty());
+    EXPECT_TRUE(reading("[Server]\nUser = u\n", mine | QFile::ReadOther).warnings.isEmpty());
+}
+
+TEST(LabFileTest, FindsTheFirstFileThatIsThereAndTellsOfOneItCannotRead) {
+    QTemporaryDir folder;
+    const HostPath base = toHostPath(folder.path());
+    EXPECT_FALSE(FindLabFile({base / "a.ini", base / "b.ini"}));
+    QFile second(folder.filePath(QStringLiteral("b.ini")));
+    ASSERT_TRUE(second.open(QIODevice::WriteOnly));
+    EXPECT_EQ(FindLabFile({base / "a.ini", base / "b.ini"}), base / "b.ini");
+    EXPECT_EQ(ReadLabFile(base / "a.ini").errors.size(), 1);
+    EXPECT_EQ(ReadLabFile(base).errors.size(), 1) << "a folder";
+    EXPECT_EQ(labFilePlaces("/opt/lumora")[0], "/opt/lumora/lab.ini");
+    EXPECT_EQ(labFilePlaces("/opt/lumora")[1], "/etc/lumora/lab.ini");
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,128 @@
+#include "session/Workspace.h"
+
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+class WorkspaceTest : public ::testing::Test {
+protected:
+    WorkspaceTest() { state.DiskRoot = machine.drives.programRoot(); }
+
+    void make() {
+        ASSERT_TRUE(workspace.MakeWorkspace().ok());
+        ASSERT_TRUE(workspace.MakeCounterFolder().ok());
+        ASSERT_TRUE(workspace.MakeOrderFolder().ok());
+    }
+    void put(const QString& path, const QByteArray& bytes = "x") {
+        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.toStdString();
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    Workspace workspace{state, machine.files};
+};
+
+TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
+    state.MisparHazmana = QStringLiteral("77");
+    make();
+    EXPECT_EQ(machine.files.folders(QStringLiteral("C:\\")), QStringList({"2000lumora", "vedron"}));
+    EXPECT_EQ(machine.files.folders(WorkspacePaths::root(state)), QStringList({"!!000", "misgarot", "zmany"}));
+    EXPECT_EQ(machine.files.folders(WorkspacePaths::zmany(state)), QStringList({"job_folder", "ktanim", "tempred"}));
+    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    EXPECT_EQ(state.MisparHazmana, u"100");
+    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")), "1\r\n");
+}
+
+TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
+    put(QStringLiteral("C:\\2000lumora"));
+    const Result<void> made = workspace.MakeWorkspace();
+    ASSERT_FALSE(made.ok());
+    EXPECT_TRUE(made.failure().message.contains(u"2000lumora")) << made.failure().message.toStdString();
+    EXPECT_FALSE(workspace.MakeRootFolders());
+    EXPECT_FALSE(workspace.CleanWorkspace().ok()) << "mana.txt has no folder to lie in";
+}
+
+TEST_F(WorkspaceTest, WritesTheNextNumberAndReadsItAtTheNextOrder) {
+    make();
+    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.writeCounter().ok());
+    EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "101\r\n");
+    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    EXPECT_EQ(state.MisparHazmana, u"101");
+}
+
+TEST_F(WorkspaceTest, TakesWhatItCanOfADamagedCounter) {
+    const struct {
+        QByteArray stored;
+        QString number;
+    } cases[] = {
+        {"105\r\n", "105"}, {"105\n", "105"}, {"105", "105"},       {"  42\r\n", "42"},
+        {"007x\r\n", "7"},  {"rubbish", "0"}, {"\r\n105\r\n", "0"}, {"-5\r\n", "0"},
+        {"12.7", "12"},     {"7 8", "7"},  {"", "55"},           {"99999999999999999999\r\n", "999999999"},
+    };
+    make();
+    for (const auto& c : cases) {
+        state.MisparHazmana = QStringLiteral("55");
+        put(WorkspacePaths::counter(state), c.stored);
+        ASSERT_TRUE(workspace.CleanWorkspace().ok());
+        EXPECT_EQ(state.MisparHazmana, c.number) << c.stored.toStdString();
+    }
+}
+
+TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
+    make();
+    const QStringList gone = {"C:\\2000lumora\\zmany\\ktanim\\b.jpg",
+                              "C:\\2000lumora\\zmany\\ktanim\\c.JPG",
+                              "C:\\2000lumora\\zmany\\tempred\\d.jpg",
+                              "C:\\2000lumora\\zmany\\job_folder\\e.txt",
+                              "C:\\2000lumora\\zmany\\job_folder\\f.BMP",
+                              "C:\\2000lumora\\!!000\\^^^.jpg",
+                              "C:\\2000lumora\\!!000\\g.gbr",
+                              "C:\\2000lumora\\!!000\\h.gbx",
+                              "C:\\2000lumora\\!!000\\111.jpg"};
+    const QStringList kept = {"C:\\2000lumora\\zmany\\ktanim\\a.Jpg",    "C:\\2000lumora\\zmany\\ktanim\\b.bmp",
+                              "C:\\2000lumora\\zmany\\tempred\\000.bmp", "C:\\2000lumora\\pratim.txt",
+                              "C:\\2000lumora\\!!000\\kept.jpp",         "C:\\2000lumora\\000.jpg"};
+    for (const QString& path : gone + kept)
+        put(path);
+    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    for (const QString& path : gone)
+        EXPECT_FALSE(machine.files.fileExists(path)) << path.toStdString();
+    for (const QString& path : kept)
+        EXPECT_TRUE(machine.files.fileExists(path)) << path.toStdString();
+}
+
+TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
+    make();
+    // A name outside the code page lists with a "?", under which there is no file.
+    const auto folder = machine.drives.toHost(WorkspacePaths::ktanim(state));
+    ASSERT_TRUE(folder);
+    const HostPath odd = *folder / "\xE6\xBC\xA2.jpg";
+    std::filesystem::copy_file("/proc/self/exe", odd);
+    put(QStringLiteral("C:\\2000lumora\\zmany\\ktanim\\z.jpg"));
+    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    EXPECT_TRUE(std::filesystem::exists(odd));
+    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\zmany\\ktanim\\z.jpg")));
+}
+
+TEST_F(WorkspaceTest, CleansTheHistoryButForTheFirstFileOfEachOrder) {
+    make();
+    const QString order = QStringLiteral("C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105");
+    const QString other = QStringLiteral("C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106");
+    ASSERT_TRUE(machine.files.makeFolder(order).ok());
+    ASSERT_TRUE(machine.files.makeFolder(other).ok());
+    for (const char* name : {"!105_1234.jpp", "1 1015.jpp", "1 1318.JPP", "order.txt", "part.prk"})
+        put(order + u'\\' + QString::fromLatin1(name));
+    put(other + QStringLiteral("\\only.jpp"));
+    workspace.CleanHistory();
+    EXPECT_EQ(machine.files.names(order, QStringLiteral("*")),
+              QStringList({"!105_1234.jpp", "1 1318.JPP", "order.txt", "part.prk"}));
+    EXPECT_EQ(machine.files.names(other, QStringLiteral("*")), QStringList({"only.jpp"}));
+}
+
+} // namespace
+} // namespace lumora
