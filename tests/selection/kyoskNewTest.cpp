@@ -1,0 +1,472 @@
+#include "selection/kyoskNew.h"
+
+#include "common/DrivePathText.h"
+#include "editing/EditRecord.h"
+#include "editing/StoredSmallView.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+// A page that is only shown.
+class NextPage : public Page {
+public:
+    using Page::Page;
+};
+
+class ThePictures : public testing::Test {
+protected:
+    ThePictures() {
+        state.DiskRoot = QStringLiteral("C:\\");
+        state.shemot.ppr = QStringLiteral("10/15");
+        state.shemot.maat = QStringLiteral("מבריק");
+        state.shemot.Bord = QStringLiteral("NB");
+        state.Optint = 1;
+        chain.registerPage(PageId::kyoskNew,
+                           [this] { return std::make_unique<kyoskNew>(state, machine.platform, chain); });
+        registerNext(PageId::hatchala);
+        registerNext(PageId::Form2);
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
+    }
+
+    void registerNext(PageId id) {
+        chain.registerPage(id, [id] { return std::make_unique<NextPage>(id); });
+    }
+
+    // count small pictures "01.jpg", ... in a folder; the folder is made.
+    void makePictures(const QString& folder, int count, PictureSize size = {40, 30}) {
+        if (folder.size() > 3) {
+            ASSERT_TRUE(machine.files.makeFolder(folder));
+        }
+        for (int i = 1; i <= count; ++i) {
+            const QString name = QStringLiteral("%1.jpg").arg(i, 2, 10, QLatin1Char('0'));
+            const auto host = machine.drives.toHost(JoinDrivePath(folder, name));
+            ASSERT_TRUE(host && saveJpeg(Bitmap(size.width, size.height, Qt::red), *host, 80));
+        }
+    }
+
+    kyoskNew& open() {
+        chain.show(PageId::kyoskNew);
+        return *static_cast<kyoskNew*>(chain.find(PageId::kyoskNew));
+    }
+
+    void pick(kyoskNew& page, const QString& picture) {
+        machine.dialogs.picks += picture;
+        page.Image5_Click();
+    }
+
+    // The page with a folder of so many pictures.
+    kyoskNew& openWith(int count) {
+        makePictures(QStringLiteral("C:\\p"), count);
+        kyoskNew& page = open();
+        pick(page, QStringLiteral("C:\\p\\01.jpg"));
+        return page;
+    }
+
+    static int shownCells(const kyoskNew& page) {
+        int shown = 0;
+        for (const auto& cell : page.Picture1)
+            shown += cell.visible && !cell.bitmap.isNull() ? 1 : 0;
+        return shown;
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain{machine.pump};
+};
+
+const QString first = QStringLiteral("C:\\p\\01.jpg");
+
+TEST_F(ThePictures, areShownTwelveAtATimeAndTheLastOneAgain) {
+    kyoskNew& page = openWith(13);
+    EXPECT_EQ(page.Label34.text, QStringLiteral("13"));
+    EXPECT_EQ(page.Label29.text, QStringLiteral("C:\\p"));
+    for (const int shown : {12, 1, 1}) {
+        EXPECT_EQ(page.List2.count(), shown);
+        EXPECT_EQ(shownCells(page), shown);
+        page.Image16_Click();
+    }
+    page.Image15_Click();
+    EXPECT_EQ(page.List2.item(0), first);
+    EXPECT_EQ(page.Picture1[0].bitmap.width(), 115);
+    EXPECT_EQ(page.Label5[0].text, first);
+}
+
+TEST_F(ThePictures, stayAsTheyAreWhenTheDialogIsCancelled) {
+    kyoskNew& page = openWith(13);
+    page.Image5_Click();
+    EXPECT_EQ(page.List4.count(), 13);
+    EXPECT_EQ(page.List4.currentIndex(), 12);
+    EXPECT_EQ(page.List2.item(0), first);
+    EXPECT_EQ(shownCells(page), 12);
+    EXPECT_EQ(machine.dialogs.pickRequests.last(), QStringLiteral("בחר תמונה אחת בלבד |C:\\|Open"));
+}
+
+TEST_F(ThePictures, ofADriveRootCarryOneBackslashAndStandOnce) {
+    makePictures(QStringLiteral("C:\\"), 2);
+    kyoskNew& page = open();
+    for (int i = 0; i < 2; ++i)
+        pick(page, QStringLiteral("C:\\02.jpg"));
+    EXPECT_EQ(page.List4.paths().items(), QStringList({QStringLiteral("C:\\01.jpg"), QStringLiteral("C:\\02.jpg")}));
+}
+
+TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesOnly) {
+    kyoskNew& page = openWith(2);
+    pick(page, QStringLiteral("C:\\?\\01.jpg"));
+    EXPECT_EQ(machine.dialogs.messages,
+              QStringList(QStringLiteral("File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English")));
+    EXPECT_EQ(page.List4.count(), 2);
+    EXPECT_TRUE(page.Picture1[0].visible);
+}
+
+TEST_F(ThePictures, leaveACellEmptyForAFileThatCannotBeRead) {
+    makePictures(QStringLiteral("C:\\p"), 3);
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\p\\02.jpg"), "no picture"));
+    kyoskNew& page = open();
+    pick(page, first);
+    EXPECT_EQ(shownCells(page), 2);
+    EXPECT_TRUE(page.Picture1[1].bitmap.isNull());
+
+    page.Picture1_Click(0);
+    const QString grade = page.Label6.text;
+    page.Picture1_Click(1);
+    EXPECT_EQ(page.List1.count(), 2);
+    EXPECT_EQ(page.Label6.text, grade);
+}
+
+TEST_F(ThePictures, areDrawnByTheLatestClickWhenClicksArriveMeanwhile) {
+    kyoskNew& page = openWith(30);
+    int pumps = 0;
+    machine.pump.onPump = [&] {
+        if (++pumps == 2)
+            page.Image16_Click();
+    };
+    page.Image16_Click();
+    EXPECT_EQ(page.List2.item(0), QStringLiteral("C:\\p\\25.jpg"));
+    EXPECT_EQ(page.List2.count(), 6);
+    EXPECT_EQ(shownCells(page), 6);
+    EXPECT_EQ(pumps, 2);
+}
+
+TEST_F(ThePictures, areChosenCountedAndCancelledInTheirCells) {
+    kyoskNew& page = openWith(3);
+    page.Picture1_Click(2);
+    page.Picture1_Click(0);
+    page.Picture1_Click(5);
+    EXPECT_EQ(page.List1.lines().items(),
+              QStringList({QStringLiteral("1 1015GNBC:\\p\\03.jpg"), QStringLiteral("1 1015GNBC:\\p\\01.jpg")}));
+    EXPECT_TRUE(page.Picture4[0].visible);
+    EXPECT_FALSE(page.Picture4[1].visible);
+
+    for (int i = 0; i < 11; ++i)
+        page.Command12_Click(2);
+    state.shemot.ppr = QStringLiteral("13/18");
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("121015GNBC:\\p\\03.jpg"));
+    EXPECT_EQ(page.Label7.text, QStringLiteral("13"));
+    page.Picture1_Click(2); // takes the paper of now, keeps the copies and the place
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("121318GNBC:\\p\\03.jpg"));
+
+    for (int i = 0; i < 100; ++i)
+        page.Command12_Click(2);
+    EXPECT_EQ(page.Label4[2].text, QStringLiteral("99"));
+    page.Command13_Click(0);
+    EXPECT_EQ(page.List1.count(), 1);
+    EXPECT_FALSE(page.Picture4[0].visible);
+    EXPECT_EQ(page.Label7.text, QStringLiteral("99"));
+    page.Command13_Click(0);
+    page.Command13_Click(7);
+    EXPECT_EQ(page.List1.count(), 1);
+    page.Picture1_Click(0);
+    EXPECT_EQ(page.Label4[0].text, QStringLiteral("1"));
+
+    page.Image8_Click();
+    EXPECT_TRUE(page.List1.isEmpty());
+    EXPECT_EQ(page.Label7.text, QStringLiteral("0"));
+}
+
+TEST_F(ThePictures, showTheirMarksAgainWhenThePageComesBackAndAlone) {
+    kyoskNew& page = openWith(14);
+    page.Picture1_Click(1);
+    page.Command12_Click(1);
+    page.Image16_Click();
+    EXPECT_FALSE(page.Picture4[1].visible);
+    page.Picture1_Click(0);
+    page.Image15_Click();
+    EXPECT_TRUE(page.Picture4[1].visible);
+    EXPECT_EQ(page.Label4[1].text, QStringLiteral("2"));
+
+    page.Command14_Click();
+    EXPECT_EQ(page.List2.items(), QStringList({QStringLiteral("C:\\p\\02.jpg"), QStringLiteral("C:\\p\\13.jpg")}));
+    EXPECT_TRUE(page.Picture4[0].visible);
+    EXPECT_EQ(page.Label4[0].text, QStringLiteral("2"));
+}
+
+TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
+    makePictures(QStringLiteral("C:\\q"), 1, {1000, 800});
+    kyoskNew& page = openWith(1);
+    page.Picture1_Click(0);
+    EXPECT_EQ(page.Label6.text, QStringLiteral("  איכות נמוכה מאוד  30 / 40"));
+    EXPECT_TRUE(page.Picture2.warning);
+    EXPECT_EQ(page.Picture2.bitmap.width(), 400);
+    for (int i = 0; i < 4; ++i) {
+        page.Image4_Click();
+        EXPECT_EQ(page.Picture2.bitmap.width(), 400);
+        EXPECT_EQ(page.Picture2.bitmap.height(), 300);
+    }
+    // At exactly 800000 pixels the text of the picture before stays, and no warning is painted.
+    pick(page, QStringLiteral("C:\\q\\01.jpg"));
+    page.Picture1_Click(1);
+    EXPECT_EQ(page.Label1.text, QStringLiteral("C:\\q\\01.jpg"));
+    EXPECT_EQ(page.Label6.text, QStringLiteral("  איכות נמוכה מאוד  30 / 40"));
+    EXPECT_FALSE(page.Picture2.warning);
+}
+
+TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
+    state.Optint = 3;
+    kyoskNew& page = openWith(14);
+    ASSERT_TRUE(page.Picture66.visible);
+    page.Picture1_Click(0);
+    page.Command12_Click(0);
+    page.Command26_Click(0);
+    EXPECT_EQ(page.List1.count(), 14);
+    EXPECT_EQ(page.Label7.text, QStringLiteral("14"));
+    EXPECT_EQ(page.List2.item(0), first);
+    EXPECT_TRUE(page.Picture4[11].visible);
+
+    page.Command23_Click();
+    EXPECT_TRUE(page.List1.isEmpty());
+    EXPECT_TRUE(page.List4.isEmpty());
+    EXPECT_EQ(page.Label7.text, QStringLiteral("0"));
+    EXPECT_FALSE(page.Frame1.visible);
+    EXPECT_EQ(shownCells(page), 0);
+    pick(page, first);
+    EXPECT_TRUE(page.Frame1.visible);
+    EXPECT_EQ(shownCells(page), 12);
+}
+
+TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
+    state.Optint = 2;
+    kyoskNew& page = openWith(3);
+    page.Picture1_Click(0);
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("1 1015GNB") + EditRecord::newPicture() + first);
+
+    QString record = EditRecord::newPicture();
+    record.replace(15, 3, QStringLiteral("130")).replace(38, 3, QStringLiteral("RED"));
+    state.edit.EditState = record;
+    page.Command12_Click(0);
+    page.Label4[0].text = QStringLiteral("55"); // shows another picture by now
+    page.ZZvvA_Click();
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("2 1015GNB") + record + first);
+    const Result<QByteArray> all = machine.files.read(QStringLiteral("C:\\2000lumora\\Tik4txt\\all_list.txt"));
+    const Result<QByteArray> one = machine.files.read(QStringLiteral("C:\\2000lumora\\Tik4txt\\00onepic.txt"));
+    ASSERT_TRUE(all && one);
+    EXPECT_EQ(*all, (page.List1.item(0) + QStringLiteral("\r\n")).toLatin1());
+    EXPECT_EQ(*one, *all);
+
+    page.Label4[0].text = QStringLiteral("2");
+    page.Picture1_Click(1);
+    EXPECT_EQ(state.edit.ZoomPercent, 100);
+    state.shemot.maat = QStringLiteral("Matte");
+    page.Picture1_Click(0);
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("2 1015MNB") + record + first);
+    EXPECT_EQ(state.edit.ZoomPercent, 130);
+    EXPECT_EQ(state.edit.TempRedName, QStringLiteral("C;]p]01.jpg"));
+    page.Command14_Click();
+    EXPECT_EQ(page.List2.item(0), first);
+}
+
+TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAnew) {
+    state.Optint = 2;
+    registerNext(PageId::tFrmNew);
+    kyoskNew& page = openWith(3);
+    page.Picture1_Click(0);
+    EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::Orange);
+    EXPECT_TRUE(page.editorView.visible);
+    page.EditorPainted(Bitmap(60, 40, Qt::blue));
+    page.Picture1_Click(1); // leaves the first
+    EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::System);
+    ASSERT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    page.Image15_Click();
+    EXPECT_GT(page.Picture1[0].bitmap.image().pixelColor(50, 30).blue(), 200);
+    EXPECT_GT(page.Picture1[1].bitmap.image().pixelColor(50, 30).red(), 200);
+
+    page.Command13_Click(0);
+    page.Picture1_Click(0);
+    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    page.Command13_Click(0);
+    EXPECT_FALSE(page.editorView.visible);
+}
+
+TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
+    kyoskNew& page = openWith(2);
+    page.Picture1_Click(0);
+    page.Picture1_Click(1);
+    page.Command12_Click(1);
+    page.Image7_Click();
+    EXPECT_TRUE(page.Frame4.visible);
+    EXPECT_FALSE(page.Pic4snifim.visible);
+    EXPECT_EQ(page.Combo1.text, QStringLiteral("בחר או הקלד"));
+    EXPECT_EQ(page.Label19.text, QStringLiteral("10/15"));
+    EXPECT_EQ(page.Label20.text, QStringLiteral("3"));
+    page.Text1_Change(QStringLiteral("dana"));
+    page.Combo1_Change(QStringLiteral("example.com"));
+    page.Text2_Change(QStringLiteral("gift"));
+    int handOvers = 0;
+    QObject::connect(&chain, &PageChain::shown, [&](Page* shown) { handOvers += shown->id() == PageId::Form2; });
+    machine.pump.onPump = [&] { page.Command8_Click(); }; // an impatient second press
+    page.Command8_Click();
+    EXPECT_EQ(handOvers, 1);
+    EXPECT_EQ(chain.front()->id(), PageId::Form2);
+    EXPECT_EQ(chain.find(PageId::kyoskNew), nullptr);
+    EXPECT_EQ(state.handOver.lines,
+              QStringList({QStringLiteral("1 1015GNBC:\\p\\01.jpg"), QStringLiteral("2 1015GNBC:\\p\\02.jpg")}));
+    EXPECT_TRUE(state.handOver.pressStart);
+    EXPECT_EQ(state.shemot.Mail, QStringLiteral("dana@example.com"));
+    EXPECT_EQ(state.shemot.Hearot, QStringLiteral("gift - "));
+}
+
+TEST_F(ThePictures, goOnWithoutAnAddressOrBackToTheChoice) {
+    kyoskNew& page = openWith(1);
+    page.Image7_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא נבחרו תמונות")));
+    EXPECT_FALSE(page.Frame4.visible);
+    page.Picture1_Click(0);
+    page.Image7_Click();
+    page.Command10_Click();
+    EXPECT_FALSE(page.Frame4.visible);
+    EXPECT_EQ(page.List1.count(), 1);
+    page.Image7_Click();
+    page.Command7_Click();
+    EXPECT_EQ(state.shemot.Mail, QStringLiteral("לא הוקלד"));
+    EXPECT_EQ(state.shemot.Hearot, QStringLiteral(" - "));
+    EXPECT_EQ(chain.front()->id(), PageId::Form2);
+}
+
+TEST_F(ThePictures, ofAnEditedOrderStayInTheBasketWhileNothingCanPrepareThem) {
+    state.Optint = 2;
+    kyoskNew& page = openWith(1);
+    page.Picture1_Click(0);
+    page.Image7_Click();
+    page.Command8_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא הקלדת כתובת דואר")));
+    EXPECT_EQ(page.focusBox, QStringLiteral("Text1"));
+    state.shemot.Mail = QStringLiteral("before");
+    page.Command7_Click();
+    EXPECT_EQ(machine.dialogs.messages.size(), 2);
+    EXPECT_EQ(chain.front(), &page);
+    EXPECT_EQ(page.List1.count(), 1);
+    EXPECT_EQ(state.shemot.Mail, QStringLiteral("before"));
+
+    registerNext(PageId::B3);
+    page.Command7_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::B3);
+    EXPECT_EQ(state.handOver.lines.size(), 1);
+    EXPECT_FALSE(state.handOver.pressStart);
+}
+
+TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
+    state.coupon.HaKoopon = 1;
+    state.coupon.MisparKoopon = 2;
+    state.profile.Branches[3] = {
+        QStringLiteral("חיפה"), QStringLiteral("סניף חיפה"), {QStringLiteral("הנביאים 1"), {}}, QStringLiteral("04-1")};
+    kyoskNew& page = openWith(1);
+    page.Picture1_Click(0);
+    page.Image7_Click();
+    EXPECT_FALSE(page.Pic4snifim.visible);
+    page.Command12_Click(0);
+    page.Command12_Click(0);
+    page.Image7_Click();
+    EXPECT_FALSE(page.Frame4.visible);
+    EXPECT_EQ(
+        machine.dialogs.messages,
+        QStringList({QStringLiteral("עליך לבחור תמונות לא פחות מהכמות שרכשת בקופון\nלא תתקבלנה הזמנות שאינן במלואן"),
+                     QStringLiteral("חרגת מכמות התמונות שרכשת בקופון\nעליך לבטל בחירה של חלק מהתמונות")}));
+    page.Command13_Click(0);
+    page.Image7_Click();
+    EXPECT_TRUE(page.Frame4.visible);
+    EXPECT_TRUE(page.Pic4snifim.visible);
+    page.Command4Snif_MouseMove(3);
+    EXPECT_EQ(page.Label41.text, QStringLiteral("סניף חיפה\nהנביאים 1\n04-1"));
+    page.Command4Snif_MouseMove(11);
+    EXPECT_EQ(page.Label41.text, QString());
+    page.Command4Snif_Click(3);
+    EXPECT_FALSE(page.Pic4snifim.visible);
+    page.Image7_Click();
+    page.Command28_Click();
+    page.Command8_Click();
+    EXPECT_EQ(state.shemot.Hearot, QStringLiteral(" - חיפה"));
+}
+
+TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
+    state.shemot.ppr = QStringLiteral("30/45");
+    for (const auto& [mode, policy, asked, on] :
+         {std::tuple{1, 2, false, 1}, {1, 1, true, 0}, {2, 1, false, 0}, {10, 2, false, 1}}) {
+        static_cast<void>(machine.files.removeFile(first));
+        state.Optint = static_cast<std::int16_t>(mode);
+        state.MediniyutDchisa = static_cast<std::int16_t>(policy);
+        state.DchisaAmoka = 0;
+        chain.unload(PageId::kyoskNew);
+        kyoskNew& page = openWith(1);
+        page.Picture1_Click(0);
+        page.Image7_Click();
+        EXPECT_EQ(page.Picture7.visible, asked);
+        EXPECT_EQ(state.DchisaAmoka, on);
+        page.Command21_Click();
+        EXPECT_EQ(state.DchisaAmoka, 1);
+        EXPECT_FALSE(page.Picture7.visible);
+    }
+}
+
+TEST_F(ThePictures, closeWithTheBoxesThatTheModeAndTheStationAskFor) {
+    struct Case {
+        std::int16_t mode;
+        bool local, optional;
+        bool text1, albumBox, required;
+    };
+    makePictures(QStringLiteral("C:\\p"), 1);
+    state.album.MailZalam = QStringLiteral("studio@example.com");
+    for (const Case& c : {Case{1, false, false, true, false, true}, Case{1, false, true, true, false, false},
+                          Case{1, true, false, false, false, false}, Case{10, false, false, false, true, true},
+                          Case{10, true, false, false, false, false}}) {
+        state.Optint = c.mode;
+        state.TachanaMekomit = c.local;
+        state.DoarReshut = c.optional;
+        chain.unload(PageId::kyoskNew);
+        kyoskNew& page = open();
+        pick(page, first);
+        page.Picture1_Click(0);
+        page.Image7_Click();
+        EXPECT_EQ(page.Text1.visible, c.text1);
+        EXPECT_EQ(page.Combo1.visible, c.text1);
+        EXPECT_EQ(page.Txt4Ml2.visible, c.albumBox);
+        EXPECT_EQ(page.Label33.visible, c.required);
+        EXPECT_EQ(page.Command8.visible, !c.local);
+        EXPECT_TRUE(page.Command7.visible);
+        if (c.albumBox) {
+            page.Command8_Click();
+            EXPECT_EQ(state.shemot.Mail, QStringLiteral("studio@example.com"));
+        }
+    }
+}
+
+TEST_F(ThePictures, areNotLeftWithoutAQuestionOnceSomeAreChosen) {
+    kyoskNew& page = openWith(1);
+    page.Picture1_Click(0);
+    page.Image10_Click();
+    EXPECT_TRUE(page.Frame3.visible);
+    EXPECT_FALSE(chain.hasEnded());
+    page.Command4_Click();
+    EXPECT_FALSE(page.Frame3.visible);
+    page.Command13_Click(0);
+    page.Image10_Click();
+    EXPECT_TRUE(chain.hasEnded());
+}
+
+} // namespace
+} // namespace lumora
