@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <fstream>
+
 namespace lumora {
 namespace {
 
@@ -102,7 +104,7 @@ TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
     const auto folder = machine.drives.toHost(WorkspacePaths::ktanim(state));
     ASSERT_TRUE(folder);
     const HostPath odd = *folder / "\xE6\xBC\xA2.jpg";
-    std::filesystem::copy_file("/proc/self/exe", odd);
+    std::ofstream(odd) << "x";
     put(QStringLiteral("C:\\2000lumora\\zmany\\ktanim\\z.jpg"));
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     EXPECT_TRUE(std::filesystem::exists(odd));

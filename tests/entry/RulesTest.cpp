@@ -1,0 +1,180 @@
+#include "entry/DetailStore.h"
+#include "entry/DetailsCheck.h"
+#include "entry/TileMenu.h"
+#include "entry/TimeOfJob.h"
+#include "entry/VolumeMark.h"
+
+#include "common/DrivePathText.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
+    const struct {
+        QString letter;
+        int tmunatPaar;
+        int minuyPaar;
+        QString tiles; // a digit for each tile that is there
+    } cases[] = {
+        {"B", 0, 1, "023458"},    {"C", 0, 1, "02458"},    {"D", 0, 1, "0258"},      {"CL", 0, 1, "024568"},
+        {"AL", 0, 1, "0124568"},  {"AS", 0, 1, "0124589"}, {"ALL", 0, 1, "0123458"}, {"", 0, 1, "0123458"},
+        {"AL", 1, 1, "01245678"}, {"AL", 0, 2, "024568"},  {"AS", 1, 2, "0245789"},
+    };
+    for (const auto& c : cases) {
+        QString shown;
+        const auto tiles = visibleTiles(c.letter, c.tmunatPaar, c.minuyPaar);
+        for (std::size_t i = 0; i < tiles.size(); ++i) {
+            if (tiles[i])
+                shown += QString::number(i);
+        }
+        EXPECT_EQ(shown, c.tiles) << c.letter.toStdString() << c.tmunatPaar << c.minuyPaar;
+    }
+}
+
+TEST(TileMenuTest, NamesTheBordersByTheirCodes) {
+    QStringList codes;
+    for (int i = 0; i < 10; ++i)
+        codes += borderCode(i);
+    EXPECT_EQ(codes, QStringList({"NB", "B7", "BB1", "BB2", "CA1", "BB", "CA9", "BL1", "FA9", "WB"}));
+    EXPECT_TRUE(borderCode(-1).isEmpty() && borderCode(10).isEmpty());
+}
+
+TEST(TimeOfJobTest, HasDayCodeAndVolumeInFixedPlaces) {
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), QStringLiteral("KUP"), QStringLiteral("1234")),
+              u"2026_11_21_KUP_1234^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), QStringLiteral("P"), QString()), u"0987_01_02_P  _^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), QStringLiteral("LONG"), QStringLiteral("7")), u"2026_01_02_LON_7^");
+}
+
+TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
+    FixedVolume volume;
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, QStringLiteral("C:\\"))), u"1234");
+    volume.number = -12;
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, QStringLiteral("C:\\"))), u"-12");
+    volume.fails = true;
+    EXPECT_FALSE(ReadVolumeSerial(volume, QStringLiteral("C:\\")).ok());
+}
+
+TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
+    using Place = DetailsProblem::Place;
+    SessionState good;
+    takeDetails(good, QStringLiteral(" Dana Levi "), QStringLiteral("call me"), QString());
+    good.shemot.ppr = QStringLiteral("10/15");
+    good.shemot.maat = QStringLiteral("מט");
+    good.shemot.Bord = QStringLiteral("NB");
+    EXPECT_EQ(good.shemot.n1, u"Dana Levi");
+    EXPECT_FALSE(CheckDetails(good)) << "a telephone with letters passes";
+
+    const struct {
+        std::function<void(SessionState&)> spoil;
+        Place place;
+        QString hebrew;
+        QString english;
+    } cases[] = {
+        {[](SessionState& s) { s.shemot = {}; }, Place::Name, "לא כתבת שם פרטי ומשפחה",
+         "Please insert First & Last Name"},
+        {[](SessionState& s) {
+             s.shemot.n2.clear();
+             s.shemot.ppr = notChosen;
+         },
+         Place::Telephone, "לא כתבתה מספר טלפון", "Please insert your Phone Number"},
+        {[](SessionState& s) { s.MishloachHabaita = true; }, Place::Address,
+         "עליך להקליד כתובתך ונדע לאן לשלוח את התמונות כפי שבקשת\nהקפד להקליד רחוב מיספר ועיר\nנא הקלד בחלונית "
+         "הירוקה\nיש לוודא שהפרטים מדוייקים",
+         "Please insert your Address\nin the green Text Box"},
+        {[](SessionState& s) {
+             s.shemot.ppr = notChosen;
+             s.shemot.maat = notChosen;
+         },
+         Place::Size, "לא בחרת גודל נייר", "Please choose a paper size"},
+        {[](SessionState& s) {
+             s.shemot.maat = notChosen;
+             s.shemot.Bord.clear();
+         },
+         Place::Kind, "לא בחר סוג נייר  מט או מבריק", "Please choose a paper kind, matte or glossy"},
+        {[](SessionState& s) { s.shemot.Bord.clear(); }, Place::Border, "לא בחרת סוג מסגרת", "Please choose a border"},
+    };
+    for (const auto& c : cases) {
+        SessionState state = good;
+        c.spoil(state);
+        for (const bool english : {false, true}) {
+            state.EnglishTips = english ? 1 : 0;
+            const auto problem = CheckDetails(state);
+            ASSERT_TRUE(problem) << c.english.toStdString();
+            EXPECT_EQ(problem->message, english ? c.english : c.hebrew);
+            EXPECT_EQ(problem->place, c.place);
+        }
+    }
+}
+
+class DetailStoreTest : public ::testing::Test {
+protected:
+    DetailStoreTest() {
+        state.DiskRoot = machine.drives.programRoot();
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace().ok());
+    }
+    void put(const QString& name, const QByteArray& bytes) {
+        ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora\\") + name, bytes).ok());
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    DetailStore store{state, machine.files};
+};
+
+TEST_F(DetailStoreTest, KeepsNameAndTelephoneInFiveLines) {
+    EXPECT_FALSE(*store.details());
+    ASSERT_TRUE(store.SaveDetails({QStringLiteral("דנה \"לוי"), QStringLiteral("03-1")}).ok());
+    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\pratim.txt")),
+              "0\r\n\"\xE3\xF0\xE4 \"\xEC\xE5\xE9\"\r\n\"03-1\"\r\n0\r\n0\r\n");
+    const auto read = store.details();
+    ASSERT_TRUE(read.ok() && *read);
+    EXPECT_EQ((*read)->name, u"דנה \"לוי");
+    EXPECT_EQ((*read)->telephone, u"03-1");
+    EXPECT_TRUE(store.forgetDetails().ok());
+    EXPECT_FALSE(*store.details());
+    EXPECT_TRUE(store.forgetDetails().ok());
+}
+
+TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
+    const struct {
+        QByteArray stored;
+        bool found;
+        QString name;
+        QString telephone;
+    } cases[] = {
+        {"", false, {}, {}},
+        {"0\r\n", false, {}, {}},
+        {"0\n\"Dana\"\n", true, "Dana", ""},
+        {"0\r\nD\r\n\"", true, "", ""},
+        {"0\n\"Dana\"\n\"03\"\n0\n0\n", true, "Dana", "03"},
+    };
+    for (const auto& c : cases) {
+        put(QStringLiteral("pratim.txt"), c.stored);
+        const auto read = store.details();
+        ASSERT_TRUE(read.ok());
+        ASSERT_EQ(read->has_value(), c.found) << c.stored.toStdString();
+        if (c.found) {
+            EXPECT_EQ((*read)->name, c.name) << c.stored.toStdString();
+            EXPECT_EQ((*read)->telephone, c.telephone);
+        }
+    }
+}
+
+TEST_F(DetailStoreTest, AnAlbumFieldThatIsMissingMovesTheOthersUp) {
+    ASSERT_TRUE(store.SaveAlbumDetails({QStringLiteral("Studio"), QString(), QStringLiteral("x")}).ok());
+    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\pratim2.txt")), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
+    const auto read = store.albumDetails();
+    ASSERT_TRUE(read.ok() && *read);
+    EXPECT_EQ((*read)->name, u"Studio");
+    EXPECT_TRUE((*read)->telephone.isEmpty()) << "one character is too short to be taken";
+    EXPECT_TRUE((*read)->mailName.isEmpty());
+}
+
+} // namespace
+} // namespace lumora

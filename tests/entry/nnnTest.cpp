@@ -1,0 +1,366 @@
+#include "entry/nnn.h"
+
+#include "common/DrivePathText.h"
+#include "entry/Havharot.h"
+#include "session/ClientProfile.h"
+#include "session/Deployment.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+const QString customerStore = QStringLiteral("C:\\2000lumora\\pratim.txt");
+
+class nnnTest : public ::testing::Test {
+protected:
+    nnnTest() {
+        state.DiskRoot = machine.drives.programRoot();
+        state.KodMishloach = QStringLiteral("KUP");
+        for (const PageId id : {PageId::hatchala, PageId::kyoskNew})
+            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
+        chain.registerPage(PageId::Havharot,
+                           [this] { return std::make_unique<Havharot>(state, machine.platform, chain); });
+        chain.registerPage(PageId::nnn, [this] { return std::make_unique<nnn>(state, machine.platform, chain); });
+    }
+    nnn& start() {
+        LoadDefaultProfile(state, deployment);
+        chain.show(PageId::nnn);
+        return static_cast<nnn&>(*chain.front());
+    }
+    // A print order as far as the terms.
+    nnn& atTerms(int tile) {
+        nnn& page = start();
+        page.Image1_Click(tile);
+        page.Text2_Change(QStringLiteral("Dana Levi"));
+        page.Text3_Change(QStringLiteral("03-1234567"));
+        page.Command12_Click();
+        page.Option1_Click(0);
+        page.Option3_Click(1);
+        if (page.step == nnn::Step::Border) {
+            page.Image13_MouseDown(9);
+            page.Command6_Click();
+        }
+        return page;
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    Deployment deployment;
+    PageChain chain{machine.pump};
+};
+
+TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
+    nnn& page = start();
+    EXPECT_EQ(state.shemot.Girsa, u"4.00");
+    EXPECT_TRUE(page.Image1[6].visible);
+    EXPECT_FALSE(page.Image1[3].visible);
+    state.transfer.HazmanaP = 1;
+    state.transfer.Mefurak = 1;
+    page.Image1_Click(0);
+    EXPECT_EQ(page.step, nnn::Step::Details);
+    EXPECT_FALSE(page.Image1[0].visible);
+    EXPECT_EQ(page.StepLine.text, u"שלב 1 מתוך 4");
+    EXPECT_EQ(state.Optint, 1);
+    EXPECT_EQ(state.shemot.ser, u"1234");
+    EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
+    EXPECT_EQ(state.transfer.HazmanaP + state.transfer.Mefurak, 0);
+    EXPECT_TRUE(machine.files.folderExists(QStringLiteral("C:\\2000lumora\\zmany\\tempred")));
+    EXPECT_FALSE(machine.files.folderExists(QStringLiteral("C:\\vedron"))) << "made before the pictures";
+
+    page.Text2_Change(QStringLiteral(" Dana Levi"));
+    page.Text3_Change(QStringLiteral("03-1234567"));
+    page.Check2_Click(true);
+    page.Command12_Click();
+    EXPECT_EQ(page.step, nnn::Step::Options);
+    EXPECT_FALSE(page.Option1[2].visible) << "the third quick size is empty";
+    page.Option1_Click(1);
+    EXPECT_EQ(page.Combo1.text, u"13/18");
+    page.Combo1_Click(4);
+    EXPECT_EQ(state.shemot.ppr, u"20/30");
+    EXPECT_FALSE(page.Option1[1].checked);
+    page.Option3_Click(0);
+    EXPECT_EQ(page.step, nnn::Step::Border);
+    EXPECT_FALSE(page.Command6.visible);
+    page.Image13_MouseDown(2);
+    EXPECT_TRUE(page.Command6.visible);
+    page.Command6_Click();
+    EXPECT_EQ(page.step, nnn::Step::Terms);
+    EXPECT_EQ(state.shemot.FillFit, u"FIL");
+    EXPECT_EQ(page.Choice.text, u"20/30 · מט · מסגרת BB1");
+
+    page.Command3_Click();
+    EXPECT_EQ(chain.front(), &page);
+    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(u"מסכים לתנאי שימוש"));
+    page.Check1_Click(true);
+    page.Command3_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::kyoskNew);
+    EXPECT_EQ(chain.find(PageId::nnn), nullptr);
+    EXPECT_EQ(state.shemot.n1, u"Dana Levi");
+    EXPECT_EQ(state.shemot.Bord, u"BB1");
+    EXPECT_EQ(state.shemot.maat, u"מט");
+    EXPECT_EQ(state.MisparHazmana, u"100");
+    EXPECT_TRUE(machine.files.folderExists(QStringLiteral("C:\\vedron")));
+    EXPECT_TRUE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")));
+    EXPECT_TRUE(machine.files.fileExists(customerStore));
+}
+
+TEST_F(nnnTest, AsksForBorderAndFitByKindOfOrderAndSwitches) {
+    const struct {
+        int tile;
+        int gvulMuzag;
+        bool fitMuzag;
+        QList<nnn::Step> steps; // behind the paper kind
+        QString bord;
+    } cases[] = {
+        {0, 1, false, {nnn::Step::Border, nnn::Step::Terms}, "WB"},
+        {0, 1, true, {nnn::Step::Border, nnn::Step::Fit}, "WB"},
+        {0, 0, true, {nnn::Step::Fit}, "NB"},
+        {2, 0, false, {nnn::Step::Terms}, "NB"},
+        {1, 1, true, {nnn::Step::Terms}, "NB"},
+    };
+    for (const auto& c : cases) {
+        deployment.GvulMuzag = static_cast<std::int16_t>(c.gvulMuzag);
+        deployment.FitMuzag = c.fitMuzag;
+        nnn& page = start();
+        page.Image1_Click(c.tile);
+        EXPECT_EQ(state.ModulRezef, c.tile == 2);
+        page.Text2_Change(QStringLiteral("Dana"));
+        page.Command12_Click();
+        page.Option1_Click(0);
+        page.Option3_Click(1);
+        QList<nnn::Step> steps = {page.step};
+        if (page.step == nnn::Step::Border) {
+            page.Image13_MouseDown(9);
+            page.Command6_Click();
+            steps += page.step;
+        }
+        EXPECT_EQ(steps, c.steps) << c.tile << c.gvulMuzag << c.fitMuzag;
+        EXPECT_EQ(state.shemot.Bord, c.bord);
+        if (page.step == nnn::Step::Fit) {
+            page.Option4_Click();
+            EXPECT_EQ(state.shemot.FillFit, u"FIT");
+            page.Command4_Click();
+            EXPECT_EQ(page.step, nnn::Step::Fit);
+            page.Option5_Click();
+            EXPECT_EQ(state.shemot.FillFit, u"FIL");
+        }
+        QList<nnn::Step> back;
+        while (page.step != nnn::Step::Menu) {
+            page.Command4_Click();
+            back.prepend(page.step);
+        }
+        EXPECT_EQ(back.mid(0, 3), QList({nnn::Step::Menu, nnn::Step::Details, nnn::Step::Options}));
+        chain.unload(PageId::nnn);
+    }
+}
+
+TEST_F(nnnTest, ATileForgetsTheChoicesOfTheOrderBefore) {
+    nnn& page = atTerms(0);
+    page.Check1_Click(true);
+    page.Command2_Click();
+    EXPECT_EQ(page.step, nnn::Step::Menu);
+    page.Image1_Click(6);
+    EXPECT_EQ(state.Optint, 10);
+    EXPECT_EQ(page.step, nnn::Step::Menu);
+    EXPECT_EQ(machine.dialogs.messages.size(), 1) << "albums are not there yet, and the page says so";
+    page.Image1_Click(0);
+    EXPECT_EQ(state.Optint, 1);
+    EXPECT_TRUE(state.shemot.Bord.isEmpty());
+    EXPECT_EQ(state.shemot.ppr + state.shemot.maat, u"******");
+    EXPECT_FALSE(page.Option1[0].checked || page.Option3[1].checked || page.Image13[9].checked || page.Check1.checked);
+    EXPECT_EQ(page.Combo1.text, u"גדלים נוספים");
+    EXPECT_EQ(page.Text2.text, u"Dana Levi") << "what was typed stays";
+    page.Command12_Click();
+    page.Option3_Click(0);
+    page.Image13_MouseDown(0);
+    page.Command6_Click();
+    page.Check1_Click(true);
+    page.Command3_Click();
+    EXPECT_EQ(machine.dialogs.messages.last(), u"לא בחרת גודל נייר");
+    EXPECT_EQ(page.step, nnn::Step::Options);
+    EXPECT_TRUE(page.Command8.visible);
+    EXPECT_FALSE(page.Command8.enabled) << "no size yet";
+    page.Option1_Click(0);
+    EXPECT_TRUE(page.Command8.enabled);
+    page.Command8_Click();
+    EXPECT_EQ(page.step, nnn::Step::Border);
+}
+
+TEST_F(nnnTest, ChecksTheDetailsBeforeTheOptions) {
+    nnn& page = start();
+    state.MishloachHabaita = true;
+    page.Image1_Click(0);
+    EXPECT_TRUE(page.Text4.visible);
+    page.Command12_Click();
+    EXPECT_EQ(machine.dialogs.messages.last(), u"נא להקליד שם ושם שפחה");
+    EXPECT_EQ(page.focusBox, u"Text2");
+    page.Text2_Change(QStringLiteral("Dana"));
+    const int focused = page.focusRequest;
+    page.Command12_Click();
+    EXPECT_EQ(machine.dialogs.messages.last(), u"בקשת שנשלח את התמונות עד הבית\nנא להקליד כתובת דואר");
+    EXPECT_EQ(page.focusBox, u"Text4");
+    EXPECT_GT(page.focusRequest, focused);
+    page.Text4_Change(QStringLiteral("Haifa"));
+    page.Command12_Click();
+    EXPECT_EQ(page.step, nnn::Step::Options);
+    EXPECT_TRUE(machine.files.fileExists(customerStore));
+}
+
+TEST_F(nnnTest, TakesTheDetailsFromMemory) {
+    nnn& page = start();
+    page.Image1_Click(0);
+    page.Command10_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList({"לא נמצאו פרטים בזיכרון נא הקלד פרטים"}));
+    EXPECT_EQ(page.step, nnn::Step::Details);
+    ASSERT_TRUE(machine.files.writeWhole(customerStore, "0\r\n").ok());
+    page.Text2_Change(QStringLiteral("typed"));
+    page.Command10_Click();
+    EXPECT_EQ(machine.dialogs.messages.size(), 2) << "one line holds no details";
+    EXPECT_EQ(page.Text2.text, u"typed");
+    ASSERT_TRUE(machine.files.writeWhole(customerStore, "0\r\n\"Dana\"\r\n\"03-1\"\r\n0\r\n0\r\n").ok());
+    page.Command10_Click();
+    EXPECT_EQ(page.Text2.text + page.Text3.text, u"Dana03-1");
+    EXPECT_EQ(page.step, nnn::Step::Options);
+    EXPECT_FALSE(page.Command12.enabled);
+    page.Command4_Click();
+    EXPECT_TRUE(page.Command12.enabled);
+    page.Command10_Click();
+    page.Text2_Change(QStringLiteral("Dan"));
+    EXPECT_TRUE(page.Command12.enabled);
+}
+
+TEST_F(nnnTest, ForgetsTheDetailsOfACustomerWhoDidNotAskToBeRemembered) {
+    nnn& page = atTerms(1);
+    EXPECT_TRUE(machine.files.fileExists(customerStore));
+    page.Check1_Click(true);
+    page.Command3_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew) << "the quick order goes to the pictures too";
+    EXPECT_EQ(state.Optint, 2);
+    EXPECT_FALSE(machine.files.fileExists(customerStore));
+}
+
+TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora"), "in the way").ok());
+    nnn& page = start();
+    page.Image1_Click(0);
+    EXPECT_EQ(page.step, nnn::Step::Menu);
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"2000lumora"));
+}
+
+TEST_F(nnnTest, StaysWithAReasonWhenTheCounterFolderCannotBeMade) {
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\vedron"), "in the way").ok());
+    nnn& page = atTerms(0);
+    page.Check1_Click(true);
+    page.Command3_Click();
+    EXPECT_EQ(chain.front(), &page);
+    EXPECT_EQ(page.step, nnn::Step::Terms);
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"vedron"));
+    ASSERT_TRUE(machine.files.removeFile(QStringLiteral("C:\\vedron")).ok());
+    page.Command3_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+}
+
+TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
+    nnn* page = &start();
+    machine.volume.fails = true;
+    page->Image1_Click(3);
+    EXPECT_EQ(machine.dialogs.messages, QStringList({"Error getting volume information."}));
+    EXPECT_EQ(page->step, nnn::Step::Menu);
+    EXPECT_EQ(state.Optint, 0);
+    EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_^");
+    machine.volume.fails = false;
+    machine.dialogs.messages.clear();
+
+    page->Image1_Click(8);
+    EXPECT_EQ(page->Command10.text, u"Details from memory");
+    EXPECT_EQ(page->Combo1.text, u"More Sizes");
+    page->Image1_Click(4);
+    EXPECT_EQ(state.Optint, 4);
+    EXPECT_TRUE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")));
+    EXPECT_EQ(machine.dialogs.messages,
+              QStringList({"The page of finished orders is not yet available in this version"}));
+    EXPECT_EQ(chain.front(), page);
+
+    page->Image1_Click(9);
+    ASSERT_EQ(chain.front()->id(), PageId::Havharot);
+    EXPECT_EQ(chain.find(PageId::nnn), nullptr);
+    auto& plain = static_cast<Havharot&>(*chain.front());
+    EXPECT_FALSE(plain.Command2.visible);
+    plain.Command1_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::hatchala) << "never a program without a page";
+
+    page = &start();
+    page->Image1_Click(7);
+    EXPECT_EQ(state.Optint, 7);
+    EXPECT_EQ(chain.front()->id(), PageId::hatchala);
+    page = &start();
+    page->Image1_Click(5);
+    EXPECT_TRUE(chain.hasEnded());
+}
+
+TEST_F(nnnTest, TheNoticeGivesWayToThePageBelow) {
+    nnn& page = start();
+    page.Command15_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::Havharot);
+    auto& notice = static_cast<Havharot&>(*chain.front());
+    notice.Command3_Click();
+    EXPECT_EQ(machine.shell.webPages, QStringList({"mailto:"}));
+    notice.Command1_Click();
+    EXPECT_EQ(chain.front(), &page);
+}
+
+TEST_F(nnnTest, CleansTheHistoryOnceItIsAsked) {
+    nnn& page = start();
+    page.Image1_Click(0);
+    page.Command2_Click();
+    const QString order = QStringLiteral("C:\\2000lumora\\!!000\\order");
+    ASSERT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora\\!!000")).ok());
+    ASSERT_TRUE(machine.files.makeFolder(order).ok());
+    for (const char* name : {"!1.jpp", "a.jpp", "order.txt"})
+        ASSERT_TRUE(machine.files.writeWhole(order + u'\\' + QString::fromLatin1(name), "x").ok());
+    page.Command14_Click();
+    EXPECT_TRUE(page.Frame1.visible && page.Command7.visible);
+    page.Command7_Click();
+    EXPECT_FALSE(page.Frame1.visible);
+    EXPECT_EQ(machine.dialogs.messages, QStringList({"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד"}));
+    EXPECT_EQ(machine.files.names(order, QStringLiteral("*")), QStringList({"!1.jpp", "order.txt"}));
+}
+
+TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
+    nnn& page = start();
+    page.Image1_Click(0);
+    page.Option1_Click(0);
+    EXPECT_FALSE(page.Label4kpn.visible);
+    page.CouponOrder(nnn::Coupon::Large);
+    page.Option1_Click(1);
+    EXPECT_EQ(state.coupon.MisparKoopon, 5);
+    EXPECT_EQ(state.shemot.ppr, u"20/30");
+    page.Option1_Click(0);
+    EXPECT_EQ(page.Label4kpn.text, u"350");
+    page.Combo1_Click(4);
+    EXPECT_EQ(state.coupon.MisparKoopon, 350) << "the list of all sizes sets no limit";
+}
+
+TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
+    nnn& page = start();
+    page.Image1_Click(1);
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora\\pratim3.txt"), "0\r\n").ok());
+    page.QuickCheck();
+    EXPECT_EQ(machine.dialogs.messages, QStringList({"אחד או יותר מהפרטים חסרים בדוק שוב בבקשה"}));
+    page.Text2_Change(QStringLiteral(" Dana "));
+    page.QuickCheck();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+    EXPECT_EQ(state.shemot.n1 + state.shemot.n2, u"DanaDana");
+    EXPECT_EQ(state.shemot.ppr + state.shemot.maat + state.shemot.Bord + state.shemot.FillFit, u"10/15מבריקNBFIT");
+    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\pratim3.txt")));
+}
+
+} // namespace
+} // namespace lumora
