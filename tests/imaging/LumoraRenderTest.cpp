@@ -1,0 +1,82 @@
+#include "JpegOfKind.h"
+#include "common/WholeFile.h"
+#include "imaging/PictureFile.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QImage>
+#include <QProcess>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+class LumoraRenderTest : public testing::Test {
+protected:
+    void SetUp() override {
+        ASSERT_TRUE(QDir(m_folder.path()).mkdir(QStringLiteral("out")));
+        ASSERT_TRUE(
+            writeWholeFile(at("a b.jpg").toStdString(), jpegOfKind(testPicture(2000, 1500), {.across = 2, .down = 2})));
+        ASSERT_TRUE(writeWholeFile(at("broken.jpg").toStdString(), "broken"));
+    }
+    QString at(const char* name) const { return m_folder.path() + u'/' + QString::fromUtf8(name); }
+
+    int run(const QStringList& arguments) {
+        QProcess program;
+        program.setWorkingDirectory(m_folder.path());
+        program.start(QStringLiteral(LUMORA_RENDER), arguments);
+        EXPECT_TRUE(program.waitForFinished(60000));
+        m_out = QString::fromUtf8(program.readAllStandardOutput());
+        m_err = QString::fromUtf8(program.readAllStandardError());
+        return program.exitStatus() == QProcess::NormalExit ? program.exitCode() : -1;
+    }
+
+    QTemporaryDir m_folder;
+    QString m_out;
+    QString m_err;
+};
+
+TEST_F(LumoraRenderTest, plainScalesToThePaperAndTellsTheTimes) {
+    EXPECT_EQ(run({"plain", "--paper", "10/15", "--time", "--out", "out", "a b.jpg"}), 0) << qPrintable(m_err);
+    EXPECT_EQ(QImage(at("out/a b.jpg")).size(), QSize(1800, 1350));
+    EXPECT_TRUE(m_out.startsWith(QStringLiteral("a b.jpg decode "))) << qPrintable(m_out);
+    EXPECT_EQ(m_out.count(u'\n'), 1);
+    EXPECT_EQ(run({"plain", "--paper=10/15", "--png", "--out", "out", "a b.jpg"}), 0);
+    EXPECT_EQ(QImage(at("out/a b.png")).size(), QSize(1800, 1350));
+}
+
+TEST_F(LumoraRenderTest, smallFillsTheCell) {
+    EXPECT_EQ(run({"small", "--size", "90", "--out", "out", "a b.jpg"}), 0) << qPrintable(m_err);
+    EXPECT_EQ(QImage(at("out/a b.png")).size(), QSize(90, 68));
+}
+
+TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
+    EXPECT_EQ(run({"plain", "--paper", "10/15", "--out", "out", "broken.jpg", "a b.jpg"}), 1);
+    EXPECT_TRUE(m_err.contains(QStringLiteral("broken.jpg"))) << qPrintable(m_err);
+    EXPECT_TRUE(QFileInfo::exists(at("out/a b.jpg")));
+    EXPECT_FALSE(QFileInfo::exists(at("out/broken.jpg")));
+}
+
+TEST_F(LumoraRenderTest, aCallThatCanNotBeUnderstoodDoesNothing) {
+    const QByteArray before = *encodeJpeg(*loadPicture(at("a b.jpg").toStdString()), 90);
+    for (const QStringList& call :
+         {QStringList{}, QStringList{"plain", "a b.jpg"}, QStringList{"plain", "--paper", "zz/zz", "a b.jpg"},
+          QStringList{"plain", "--paper"}, QStringList{"small", "--size", "0", "--out", "out", "a b.jpg"},
+          QStringList{"small", "--size", "9x", "--out", "out", "a b.jpg"}, QStringList{"large", "a b.jpg"},
+          QStringList{"small"}, QStringList{"small", "--sise", "90", "a b.jpg"},
+          QStringList{"small", "--out", "no such folder", "a b.jpg"},
+          QStringList{"plain", "--paper", "10/15", "--out", ".", "a b.jpg"},
+          QStringList{"plain", "--paper", "10/15", "--out", "out", "a b.jpg", "./a b.jpg"}}) {
+        EXPECT_EQ(run(call), 2) << qPrintable(call.join(u' '));
+        EXPECT_TRUE(m_err.startsWith(QStringLiteral("lumora-render: "))) << qPrintable(m_err);
+    }
+    EXPECT_EQ(*encodeJpeg(*loadPicture(at("a b.jpg").toStdString()), 90), before);
+    EXPECT_TRUE(QDir(at("out")).isEmpty());
+    EXPECT_EQ(run({"--help"}), 0);
+    EXPECT_TRUE(m_out.contains(QStringLiteral("--paper")));
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,286 @@
+#include "imaging/PictureFile.h"
+
+#include "JpegOfKind.h"
+#include "common/WholeFile.h"
+
+#include <QBuffer>
+#include <QDir>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <sys/stat.h>
+#include <thread>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+class PictureFileTest : public testing::Test {
+protected:
+    fs::path write(const std::string& name, const QByteArray& bytes) {
+        const fs::path path = fs::path(m_folder.path().toStdString()) / name;
+        EXPECT_TRUE(writeWholeFile(path, bytes));
+        return path;
+    }
+    fs::path in(const std::string& name) const { return fs::path(m_folder.path().toStdString()) / name; }
+    QStringList leftovers() const { return QDir(m_folder.path()).entryList(QDir::Files | QDir::Hidden); }
+
+    static QByteArray saved(const Bitmap& picture, const char* format) {
+        QByteArray bytes;
+        QBuffer buffer(&bytes);
+        buffer.open(QIODevice::WriteOnly);
+        EXPECT_TRUE(picture.image().save(&buffer, format));
+        return bytes;
+    }
+
+    QTemporaryDir m_folder;
+};
+
+double meanDifference(const Bitmap& a, const Bitmap& b) {
+    if (a.width() != b.width() || a.height() != b.height())
+        return 1000;
+    double sum = 0;
+    for (int y = 0; y < a.height(); ++y) {
+        for (int x = 0; x < a.width(); ++x) {
+            const QRgb p = a.image().pixel(x, y);
+            const QRgb q = b.image().pixel(x, y);
+            sum += std::abs(qRed(p) - qRed(q)) + std::abs(qGreen(p) - qGreen(q)) + std::abs(qBlue(p) - qBlue(q));
+        }
+    }
+    return sum / (3.0 * a.width() * a.height());
+}
+
+QByteArray withSize(QByteArray jpeg, int width, int height) {
+    const auto frame = jpeg.indexOf("\xFF\xC0");
+    const auto put = [&](qsizetype at, int value) {
+        jpeg[at] = static_cast<char>(value >> 8);
+        jpeg[at + 1] = static_cast<char>(value & 255);
+    };
+    put(frame + 5, height);
+    put(frame + 7, width);
+    return jpeg;
+}
+
+TEST_F(PictureFileTest, everyKindOfJpegShowsAndScalesTheSamePicture) {
+    using Colours = JpegKind::Colours;
+    struct Case {
+        const char* name;
+        JpegKind kind;
+    };
+    const Case cases[] = {
+        {"4:4:4", {}},
+        {"4:2:2", {.across = 2}},
+        {"4:4:0", {.down = 2}},
+        {"4:2:0", {.across = 2, .down = 2}},
+        {"4:1:1", {.across = 4}},
+        {"progressive", {.across = 2, .down = 2, .progressive = true}},
+        {"restarts", {.across = 2, .down = 2, .restartRows = 1}},
+        {"rgb", {.colours = Colours::Rgb}},
+        {"cmyk", {.colours = Colours::Inks}},
+        {"cmyk inverted", {.colours = Colours::InvertedInks}},
+        {"ycck", {.colours = Colours::InvertedYcck}},
+    };
+    for (const PictureSize size : {PictureSize{640, 480}, PictureSize{641, 479}, PictureSize{333, 517}}) {
+        const Bitmap original = testPicture(size.width, size.height);
+        const PictureSize third{size.width / 3, size.height / 3};
+        const Bitmap wanted = *loadPictureScaled(write("original.png", saved(original, "PNG")), third);
+        for (const Case& one : cases) {
+            SCOPED_TRACE(one.name);
+            const fs::path path = write("one.jpg", jpegOfKind(original, one.kind));
+            ASSERT_EQ(*readPictureSize(path), size);
+            const auto whole = loadPicture(path);
+            ASSERT_TRUE(whole);
+            EXPECT_LT(meanDifference(*whole, original), 4);
+            const auto scaled = loadPictureScaled(path, third);
+            ASSERT_TRUE(scaled);
+            EXPECT_LT(meanDifference(*scaled, wanted), 2.5);
+            const auto print = scalePictureToJpeg(path, third, 95);
+            ASSERT_TRUE(print);
+            const auto printed = loadPicture(write("print.jpg", *print));
+            ASSERT_TRUE(printed);
+            EXPECT_LT(meanDifference(*printed, wanted), 5);
+        }
+    }
+}
+
+TEST_F(PictureFileTest, aGreyFileGivesGreyPixelsAndAColourPrint) {
+    const fs::path path = write("grey.jpg", jpegOfKind(testPicture(320, 200), {.colours = JpegKind::Colours::Grey}));
+    const auto print = scalePictureToJpeg(path, {100, 63}, 90);
+    ASSERT_TRUE(print);
+    EXPECT_EQ(static_cast<unsigned char>(print->at(print->indexOf("\xFF\xC0") + 9)), 3) << "components";
+    for (const auto& picture :
+         {loadPicture(path), loadPictureScaled(path, {100, 63}), loadPicture(write("p.jpg", *print))}) {
+        ASSERT_TRUE(picture);
+        for (int x = 0; x < picture->width(); x += 7) {
+            const QRgb c = picture->image().pixel(x, picture->height() / 2);
+            EXPECT_EQ(qRed(c), qGreen(c));
+            EXPECT_EQ(qRed(c), qBlue(c));
+        }
+    }
+}
+
+TEST_F(PictureFileTest, aFaultyFileIsAFailureThatNamesItAndLeavesNoPrint) {
+    using Kind = Failure::Kind;
+    const Bitmap picture = testPicture(320, 240);
+    const QByteArray jpeg = jpegOfKind(picture, {.across = 2, .down = 2});
+    const QByteArray progressive = jpegOfKind(picture, {.progressive = true});
+    const QByteArray restarts = jpegOfKind(picture, {.restartRows = 1});
+    const QByteArray bmp = saved(picture, "BMP");
+    const QByteArray png = saved(picture, "PNG");
+    QByteArray damaged = restarts;
+    const auto hit = damaged.size() * 2 / 3;
+    damaged.replace(hit, 40, QByteArray(40, '\xFF'));
+    QByteArray endsEarly = jpeg.left(jpeg.size() / 2) + "\xFF\xD9";
+    QByteArray noPixelsBmp = bmp;
+    noPixelsBmp.replace(18, 4, QByteArray(4, '\0'));
+    QByteArray hugeBmp = bmp;
+    hugeBmp.replace(18, 8, QByteArray("\x20\x4E\x00\x00\x20\x4E\x00\x00", 8)); // 20000 by 20000
+
+    struct Case {
+        const char* name;
+        QByteArray bytes;
+        Kind kind;
+    };
+    const Case cases[] = {
+        {"empty.jpg", {}, Kind::Damaged},
+        {"text.jpg", "no picture at all", Kind::Unsupported},
+        {"marker only.jpg", "\xFF\xD8\xFF", Kind::Damaged},
+        {"header only.jpg", jpeg.left(200), Kind::Damaged},
+        {"cut in half.jpg", jpeg.left(jpeg.size() / 2), Kind::Damaged},
+        {"without its last bytes.jpg", jpeg.left(jpeg.size() - 2), Kind::Damaged},
+        {"ends early.jpg", endsEarly, Kind::Damaged},
+        {"progressive cut.jpg", progressive.left(progressive.size() * 3 / 4), Kind::Damaged},
+        {"damaged.jpg", damaged, Kind::Damaged},
+        {"0 by 0.jpg", withSize(jpeg, 0, 0), Kind::Damaged},
+        {"65500 by 65500.jpg", withSize(jpeg, 65500, 65500), Kind::TooLarge},
+        {"65535 by 1.jpg", withSize(jpeg, 65535, 1), Kind::TooLarge},
+        {"claims what it can't hold.jpg", withSize(jpeg, 15000, 15000), Kind::Damaged},
+        {"cut.png", png.left(png.size() / 2), Kind::Damaged},
+        {"cut.bmp", bmp.left(bmp.size() / 2), Kind::Damaged},
+        {"no pixels.bmp", noPixelsBmp, Kind::Damaged},
+        {"huge.bmp", hugeBmp, Kind::TooLarge},
+    };
+    for (const Case& one : cases) {
+        SCOPED_TRACE(one.name);
+        const fs::path path = write(one.name, one.bytes);
+        const auto whole = loadPicture(path);
+        ASSERT_FALSE(whole);
+        EXPECT_EQ(whole.failure().kind, one.kind) << qPrintable(whole.failure().message);
+        EXPECT_TRUE(whole.failure().message.contains(QString::fromUtf8(one.name)));
+        EXPECT_FALSE(loadPictureScaled(path, {40, 30}));
+        EXPECT_FALSE(scalePictureFile(path, in("print.jpg"), {40, 30}, 90));
+        EXPECT_FALSE(fs::exists(in("print.jpg")));
+    }
+    EXPECT_EQ(leftovers().filter(QStringLiteral(".lumora")), QStringList());
+}
+
+TEST_F(PictureFileTest, whatIsNoFileIsRefusedAtOnce) {
+    ASSERT_EQ(::mkfifo(in("pipe.jpg").c_str(), 0600), 0);
+    EXPECT_EQ(loadPicture(in("pipe.jpg")).failure().kind, Failure::Kind::Unsupported);
+    EXPECT_EQ(loadPicture(in("")).failure().kind, Failure::Kind::Unsupported);
+    EXPECT_EQ(loadPicture(in("missing.jpg")).failure().kind, Failure::Kind::NotFound);
+}
+
+TEST_F(PictureFileTest, theContentAndNotTheEndingSaysWhatAFileIs) {
+    const Bitmap picture = testPicture(60, 40);
+    for (const char* format : {"BMP", "PNG"}) {
+        const fs::path path = write("misnamed.jpg", saved(picture, format));
+        EXPECT_EQ(*readPictureSize(path), (PictureSize{60, 40}));
+        const auto loaded = loadPicture(path);
+        ASSERT_TRUE(loaded) << format;
+        EXPECT_EQ(meanDifference(*loaded, picture), 0);
+        EXPECT_TRUE(scalePictureToJpeg(path, {30, 20}, 90));
+    }
+    EXPECT_TRUE(loadPicture(write("really a jpeg.bmp", jpegOfKind(picture, {}))));
+}
+
+TEST_F(PictureFileTest, transparentPlacesPrintWhite) {
+    const fs::path path = write("glass.png", saved(Bitmap(64, 64, QColor(255, 0, 0, 0)), "PNG"));
+    const auto printed = loadPicture(write("p.jpg", *scalePictureToJpeg(path, {32, 32}, 90)));
+    ASSERT_TRUE(printed);
+    EXPECT_EQ(printed->image().pixel(16, 16), qRgb(255, 255, 255));
+}
+
+TEST_F(PictureFileTest, aWhitePictureStaysWhiteToItsEdgesAtEverySize) {
+    const fs::path path = write("white.jpg", *encodeJpeg(Bitmap(403, 301, Qt::white), 92));
+    for (const PictureSize size : {PictureSize{403, 301}, PictureSize{201, 150}, PictureSize{115, 86},
+                                   PictureSize{13, 9}, PictureSize{1, 1}, PictureSize{500, 400}}) {
+        const auto scaled = loadPictureScaled(path, size);
+        ASSERT_TRUE(scaled);
+        EXPECT_EQ(meanDifference(*scaled, Bitmap(size.width, size.height, Qt::white)), 0);
+        const auto printed = loadPicture(write("p.jpg", *scalePictureToJpeg(path, size, 90)));
+        ASSERT_TRUE(printed);
+        EXPECT_EQ(meanDifference(*printed, Bitmap(size.width, size.height, Qt::white)), 0);
+    }
+}
+
+TEST_F(PictureFileTest, qualityIsHeldBetween0And100) {
+    const Bitmap picture = testPicture(200, 100);
+    EXPECT_EQ(*encodeJpeg(picture, 150), *encodeJpeg(picture, 100));
+    EXPECT_EQ(*encodeJpeg(picture, -5), *encodeJpeg(picture, 0));
+    EXPECT_GT(encodeJpeg(picture, 100)->size(), encodeJpeg(picture, 0)->size());
+    EXPECT_FALSE(encodeJpeg(Bitmap(), 90));
+}
+
+TEST_F(PictureFileTest, aSaveThatFailsKeepsTheOldFile) {
+    const fs::path old = write("old.jpg", "old");
+    fs::permissions(in(""), fs::perms::owner_read | fs::perms::owner_exec);
+    const auto saved = saveJpeg(testPicture(20, 20), old, 90);
+    fs::permissions(in(""), fs::perms::owner_all);
+    if (::geteuid() != 0) {
+        ASSERT_FALSE(saved);
+        EXPECT_EQ(saved.failure().kind, Failure::Kind::AccessDenied);
+    }
+    const auto nowhere = saveJpeg(testPicture(20, 20), in("no such folder") / "a.jpg", 90);
+    ASSERT_FALSE(nowhere);
+    EXPECT_EQ(nowhere.failure().kind, Failure::Kind::NotFound);
+    const auto overFolder = saveJpeg(testPicture(20, 20), in(""), 90);
+    EXPECT_FALSE(overFolder);
+    EXPECT_EQ(leftovers(), QStringList{QStringLiteral("old.jpg")});
+}
+
+TEST_F(PictureFileTest, theSmallPictureFillsItsCellByTheLongerSide) {
+    struct Case {
+        PictureSize picture;
+        PictureSize small;
+    };
+    for (const Case& one : {Case{{4000, 3000}, {115, 86}}, Case{{3000, 4000}, {86, 115}}, Case{{500, 500}, {115, 115}},
+                            Case{{60000, 10}, {115, 1}}, Case{{10, 60000}, {1, 115}}, Case{{40, 30}, {115, 86}}})
+        EXPECT_EQ(smallPictureSize(one.picture, 115), one.small) << one.picture.width << " x " << one.picture.height;
+}
+
+TEST_F(PictureFileTest, smallPicturesComeInOrderWithAFailureInItsPlace) {
+    std::vector<fs::path> paths;
+    for (int i = 0; i < 9; ++i)
+        paths.push_back(
+            write(std::to_string(i) + ".jpg",
+                  i == 4 ? QByteArray("broken") : *encodeJpeg(Bitmap(300 + i, 200, QColor(20 * i, 0, 0)), 95)));
+    const auto pictures = loadSmallPictures(paths, 90);
+    ASSERT_EQ(pictures.size(), paths.size());
+    for (int i = 0; i < 9; ++i) {
+        ASSERT_EQ(pictures[static_cast<std::size_t>(i)].ok(), i != 4);
+        if (i != 4) {
+            EXPECT_NEAR(qRed(pictures[static_cast<std::size_t>(i)]->image().pixel(40, 30)), 20 * i, 2);
+        }
+    }
+    EXPECT_TRUE(loadSmallPictures({}, 90).empty());
+}
+
+TEST_F(PictureFileTest, threadsGiveTheSameBytes) {
+    const fs::path path = write("a.jpg", jpegOfKind(testPicture(1200, 900), {.across = 2, .down = 2}));
+    const QByteArray alone = *scalePictureToJpeg(path, {450, 338}, 90);
+    QByteArray first;
+    QByteArray second;
+    {
+        std::jthread other([&] { second = *scalePictureToJpeg(path, {450, 338}, 90); });
+        first = *scalePictureToJpeg(path, {450, 338}, 90);
+    }
+    EXPECT_EQ(first, alone);
+    EXPECT_EQ(second, alone);
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,188 @@
+#include "imaging/Resample.h"
+
+#include "JpegOfKind.h"
+#include "common/WholeFile.h"
+#include "imaging/Drawing.h"
+#include "imaging/PlaneScaler.h"
+#include "support/ReferenceScaling.h"
+#include "support/SamplePhotographs.h"
+
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <numeric>
+
+namespace lumora {
+namespace {
+
+ReferencePlane lumaOf(const Bitmap& picture) {
+    ReferencePlane plane{picture.width(), picture.height(), {}};
+    for (int y = 0; y < plane.height; ++y) {
+        for (int x = 0; x < plane.width; ++x)
+            plane.samples.push_back(qGreen(picture.image().pixel(x, y)));
+    }
+    return plane;
+}
+
+TEST(ResampleTest, theWeightsOfEverySampleSumToExactlyOne) {
+    for (const double step : {0.3, 0.5, 1.0, 1.37, 2.0, 20.0 / 9, 7.77, 100.0}) {
+        const int count = static_cast<int>(500 / step);
+        const CubicWeights weights = CubicWeights::make(500, count, step);
+        for (int i = 0; i < count; ++i) {
+            const auto begin = weights.weights.begin() + std::ptrdiff_t{i} * weights.taps;
+            EXPECT_EQ(std::accumulate(begin, begin + weights.taps, 0), 16384) << step << " at " << i;
+        }
+    }
+}
+
+TEST(ResampleTest, aFlatPictureStaysFlatToTheLastBit) {
+    for (const QColor& colour : {QColor(Qt::white), QColor(Qt::black), QColor(1, 128, 254), QColor(40, 80, 120, 200)}) {
+        const Bitmap flat(97, 61, colour);
+        const QRgb expected =
+            flat.image().constBits() != nullptr ? reinterpret_cast<const QRgb*>(flat.image().constScanLine(0))[0] : 0;
+        for (const PictureSize size :
+             {PictureSize{97, 61}, PictureSize{31, 20}, PictureSize{1, 1}, PictureSize{211, 140}}) {
+            const Bitmap scaled = resampled(flat, size);
+            ASSERT_EQ(scaled.width(), size.width);
+            for (int y = 0; y < size.height; ++y) {
+                for (int x = 0; x < size.width; ++x)
+                    ASSERT_EQ(reinterpret_cast<const QRgb*>(scaled.image().constScanLine(y))[x], expected);
+            }
+        }
+    }
+}
+
+TEST(ResampleTest, theSameSizeIsTheSamePicture) {
+    const Bitmap picture = testPicture(123, 77);
+    EXPECT_EQ(resampled(picture, {123, 77}).image(), picture.image());
+}
+
+TEST(ResampleTest, aMirroredPictureGivesTheMirroredResult) {
+    const Bitmap picture = testPicture(203, 151);
+    const Bitmap mirrored(picture.image().mirrored(true, true));
+    // Half rounds up, so a mirrored sum may differ in its last bit.
+    const ReferencePlane a = lumaOf(resampled(picture, {90, 67}));
+    const ReferencePlane b = lumaOf(Bitmap(resampled(mirrored, {90, 67}).image().mirrored(true, true)));
+    EXPECT_GT(peakSignalToNoise(a, b), 70);
+}
+
+TEST(ResampleTest, aFineCheckerBecomesEvenGrey) {
+    Bitmap checker(64, 64, Qt::black);
+    for (int y = 0; y < 64; ++y) {
+        for (int x = 0; x < 64; ++x) {
+            if ((x / 2 + y / 2) % 2 != 0)
+                checker.image().setPixel(x, y, qRgb(255, 255, 255));
+        }
+    }
+    const Bitmap small = resampled(checker, {16, 16});
+    for (int y = 1; y < 15; ++y) {
+        for (int x = 1; x < 15; ++x)
+            EXPECT_NEAR(qGreen(small.image().pixel(x, y)), 127.5, 4) << x << ", " << y;
+    }
+}
+
+TEST(ResampleTest, staysWithinTheRoundingOfTheExactCurve) {
+    const Bitmap photograph = samplePhotograph({803, 601}, 7);
+    for (const PictureSize size :
+         {PictureSize{361, 270}, PictureSize{115, 86}, PictureSize{700, 590}, PictureSize{1000, 800}}) {
+        const ReferencePlane exact =
+            referenceScaled(lumaOf(photograph), size.width, size.height, 803.0 / size.width, 601.0 / size.height);
+        EXPECT_GE(peakSignalToNoise(lumaOf(resampled(photograph, size)), exact), 55) << size.width;
+    }
+}
+
+TEST(ResampleTest, everyKindOfProcessorGivesTheSameBytes) {
+    const QTemporaryDir folder;
+    const std::filesystem::path path = std::filesystem::path(folder.path().toStdString()) / "a.jpg";
+    const auto kernels = allKernels();
+    ASSERT_EQ(kernels.front().name, "plain");
+    ASSERT_GE(kernels.size(), 2U) << "no vector kernels on this machine";
+    for (const PictureSize source : {PictureSize{1600, 1200}, PictureSize{1203, 1601}, PictureSize{37, 19}}) {
+        ASSERT_TRUE(writeWholeFile(path, samplePhotographFile(source, 3)));
+        for (const PictureSize size : {PictureSize{721, 541}, PictureSize{115, 86}, PictureSize{37, 19}}) {
+            QByteArray plain;
+            Bitmap plainPixels;
+            for (const NamedKernels& one : kernels) {
+                auto reader = JpegReader::open(std::move(*PictureInput::open(path)));
+                ASSERT_TRUE(reader);
+                const auto bytes = readResampledToJpeg(**reader, size, 90, one.kernels);
+                ASSERT_TRUE(bytes);
+                const Bitmap pixels = resampled(testPicture(source.width, source.height), size, one.kernels);
+                if (one.name == "plain") {
+                    plain = *bytes;
+                    plainPixels = pixels;
+                }
+                EXPECT_EQ(*bytes, plain) << one.name << ' ' << size.width;
+                EXPECT_EQ(pixels.image(), plainPixels.image()) << one.name << ' ' << size.width;
+            }
+        }
+    }
+}
+
+TEST(ResampleTest, aScaledDecodeKeepsTwiceThePixelsWanted) {
+    EXPECT_EQ(decodeDenominator({4000, 3000}, {1800, 1350}), 1);
+    EXPECT_EQ(decodeDenominator({4000, 3000}, {1000, 750}), 2);
+    EXPECT_EQ(decodeDenominator({4000, 3000}, {115, 86}), 8);
+    EXPECT_EQ(decodeDenominator({4000, 3000}, {251, 188}), 4);
+    EXPECT_EQ(decodeDenominator({10, 10}, {1, 1}), 4);
+}
+
+TEST(DrawingTest, fourQuarterTurnsAreThePictureAgain) {
+    const Bitmap picture = testPicture(40, 30);
+    for (const QuarterTurn turn : {QuarterTurn::Right, QuarterTurn::Left}) {
+        Bitmap result = picture;
+        for (int i = 0; i < 4; ++i)
+            result = turned(result, turn);
+        EXPECT_EQ(result.image(), picture.image());
+    }
+    EXPECT_EQ(turned(turned(picture, QuarterTurn::Half), QuarterTurn::Half).image(), picture.image());
+    EXPECT_EQ(turned(turned(picture, QuarterTurn::Right), QuarterTurn::Left).image(), picture.image());
+}
+
+TEST(DrawingTest, aTurnedDrawFillsItsBoxWithTheCornersInTheirPlaces) {
+    Bitmap picture(300, 400, Qt::white);
+    for (int y = 0; y < 100; ++y) {
+        for (int x = 0; x < 100; ++x)
+            picture.image().setPixel(x, y, qRgb(255, 0, 0)); // marks the source's top left corner
+    }
+    struct Case {
+        QuarterTurn turn;
+        QPoint mark;
+    };
+    for (const Case& one : {Case{QuarterTurn::None, {2, 2}}, Case{QuarterTurn::Right, {77, 2}},
+                            Case{QuarterTurn::Half, {77, 57}}, Case{QuarterTurn::Left, {2, 57}}}) {
+        Bitmap sheet(100, 80, Qt::black);
+        drawTurned(sheet, QRect(10, 10, 80, 60), picture, one.turn);
+        for (const QPoint corner : {QPoint(2, 2), QPoint(77, 2), QPoint(77, 57), QPoint(2, 57)})
+            EXPECT_EQ(sheet.image().pixel(corner + QPoint(10, 10)),
+                      corner == one.mark ? qRgb(255, 0, 0) : qRgb(255, 255, 255));
+        EXPECT_EQ(sheet.image().pixel(9, 40), qRgb(0, 0, 0));
+        EXPECT_EQ(sheet.image().pixel(10, 10) == qRgb(0, 0, 0), false) << "the box is filled to its edge";
+        EXPECT_EQ(sheet.image().pixel(90, 40), qRgb(0, 0, 0));
+    }
+}
+
+int inkedRows(const Bitmap& picture) {
+    int rows = 0;
+    for (int y = 0; y < picture.height(); ++y) {
+        bool inked = false;
+        for (int x = 0; x < picture.width(); ++x)
+            inked = inked || picture.image().pixel(x, y) != qRgb(255, 255, 255);
+        rows += inked ? 1 : 0;
+    }
+    return rows;
+}
+
+TEST(DrawingTest, davidIsDrawnAndAFamilyThatDoesNotExistDrawsNothing) {
+    const QString text = QStringLiteral("שלום Lumora\r\n2024");
+    Bitmap known(200, 80, Qt::white);
+    drawText(known, {5, 5}, text, {.family = QStringLiteral("David"), .pixelSize = 24});
+    EXPECT_GT(inkedRows(known), 24) << "two lines";
+    Bitmap unknown(200, 80, Qt::white);
+    drawText(unknown, {5, 5}, text, {.family = QStringLiteral("No Such Family"), .pixelSize = 24});
+    EXPECT_EQ(inkedRows(unknown), 0);
+}
+
+} // namespace
+} // namespace lumora
