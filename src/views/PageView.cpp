@@ -1,0 +1,289 @@
+#include "views/PageView.h"
+
+#include "views/Keyboard.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QSignalBlocker>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// About a frame of the screen: long loops pump far more often than a person can see.
+constexpr int renderPace = 16;
+
+QString shownOnButton(const QString& text)
+{
+    return isolated(text.trimmed()).replace(u'&', u"&&"_s);
+}
+
+void fillCombo(QComboBox& box, const TextList& list, const Caption& caption)
+{
+    const QSignalBlocker quiet(box);
+    bool same = box.count() == list.count();
+    for (int i = 0; same && i < list.count(); ++i)
+        same = box.itemData(i).toString() == list.item(i);
+    if (!same) {
+        box.clear();
+        for (const QString& item : list.items())
+            box.addItem(isolated(item), item);
+    }
+    const int row = list.find(caption.text);
+    box.setPlaceholderText(isolated(caption.text));
+    if (box.currentIndex() != row)
+        box.setCurrentIndex(row);
+}
+
+void fillList(QListWidget& widget, const TextList& list)
+{
+    const QSignalBlocker quiet(widget);
+    bool same = widget.count() == list.count();
+    for (int i = 0; same && i < list.count(); ++i)
+        same = widget.item(i)->data(Qt::UserRole).toString() == list.item(i);
+    if (!same) {
+        widget.clear();
+        for (const QString& item : list.items()) {
+            auto* row = new QListWidgetItem(isolated(item.trimmed()), &widget);
+            row->setData(Qt::UserRole, item);
+        }
+    }
+    if (widget.currentRow() != list.currentIndex())
+        widget.setCurrentRow(list.currentIndex());
+}
+
+} // namespace
+
+PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
+    : m_page(page)
+    , m_state(state)
+    , m_theme(theme)
+{
+    setObjectName(pageName(page.id()));
+    setRole(this, "page");
+    setAttribute(Qt::WA_StyledBackground);
+    setFocusPolicy(Qt::NoFocus);
+    auto* column = new QVBoxLayout(this);
+    column->setContentsMargins(0, 0, 0, 0);
+    m_frame = new PageFrame(theme, this);
+    column->addWidget(m_frame);
+    m_soon.setSingleShot(true);
+    connect(&m_soon, &QTimer::timeout, this, &PageView::renderNow);
+    connect(&page, &Page::changed, this, &PageView::schedule);
+}
+
+void PageView::start()
+{
+    m_dirty = true;
+    renderNow();
+}
+
+void PageView::schedule()
+{
+    m_dirty = true;
+    if (m_detached || m_soon.isActive())
+        return;
+    const qint64 since = m_sinceRender.isValid() ? m_sinceRender.elapsed() : renderPace;
+    m_soon.start(static_cast<int>(std::clamp<qint64>(renderPace - since, 0, renderPace)));
+}
+
+void PageView::renderNow()
+{
+    m_soon.stop();
+    if (m_detached || !m_dirty)
+        return;
+    m_dirty = false;
+    setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    m_frame->steps().setTexts(m_state.english()
+                                  ? QStringList{u"Start"_s, u"Details"_s, u"Pictures"_s, u"Preparing"_s, u"Sending"_s}
+                                  : QStringList{u"התחלה"_s, u"פרטים"_s, u"תמונות"_s, u"הכנה"_s, u"שליחה"_s},
+                              wording(u"שלב: "_s, u"Step: "_s));
+    renderBindings();
+    render();
+    m_sinceRender.start();
+}
+
+void PageView::detach()
+{
+    m_detached = true;
+    m_soon.stop();
+    disconnect(&m_page, nullptr, this, nullptr);
+}
+
+const PageView::Control* PageView::control(const QString& name) const
+{
+    const auto at = std::find_if(m_controls.begin(), m_controls.end(), [&](const Control& c) { return c.name == name; });
+    return at == m_controls.end() ? nullptr : &*at;
+}
+
+void PageView::renderBindings()
+{
+    for (const Control& control : m_controls) {
+        QWidget* widget = control.widget;
+        if (!widget)
+            continue;
+        if (control.list) {
+            if (auto* list = qobject_cast<QListWidget*>(widget))
+                fillList(*list, *control.list);
+            else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
+                fillCombo(*box, *control.list, *control.caption);
+        }
+        if (!control.caption)
+            continue;
+        const Caption& caption = *control.caption;
+        if (auto* check = qobject_cast<QCheckBox*>(widget)) {
+            const QSignalBlocker quiet(check);
+            check->setChecked(static_cast<const CheckCaption&>(caption).checked);
+        }
+        if (auto* edit = qobject_cast<QLineEdit*>(widget)) {
+            if (edit->text() != caption.text) {
+                const QSignalBlocker quiet(edit);
+                edit->setText(caption.text);
+            }
+        } else if (auto* button = qobject_cast<QAbstractButton*>(widget)) {
+            const QString text = shownOnButton(caption.text);
+            if (button->text() != text)
+                button->setText(text);
+            if (!button->property("spoken").toBool())
+                button->setAccessibleName(caption.text.simplified());
+        } else if (auto* label = qobject_cast<QLabel*>(widget)) {
+            const QString text = isolated(caption.text);
+            if (label->text() != text)
+                label->setText(text);
+        }
+        if (widget->isHidden() == caption.visible)
+            widget->setVisible(caption.visible);
+        if (widget->isEnabledTo(widget->parentWidget()) != caption.enabled)
+            widget->setEnabled(caption.enabled);
+        if (widget->toolTip() != caption.hint)
+            widget->setToolTip(caption.hint);
+    }
+}
+
+void PageView::keyPressEvent(QKeyEvent* event)
+{
+    QWidget* focus = QApplication::focusWidget();
+    if (pressByEnter(*event, focus))
+        return;
+    if ((event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && qobject_cast<QLineEdit*>(focus)) {
+        for (const Control& control : m_controls) {
+            auto* main = qobject_cast<QPushButton*>(control.widget);
+            if (main && main->property("role") == u"main"_s && main->isVisible() && main->isEnabled()) {
+                main->click();
+                return;
+            }
+        }
+    }
+    if (event->key() == Qt::Key_Escape)
+        escape();
+    else
+        QWidget::keyPressEvent(event);
+}
+
+QPushButton* PageView::button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
+                              const QString& icon)
+{
+    auto* made = new QPushButton(this);
+    static constexpr const char* roles[] = {"main", "secondary", "plain", "quiet", "danger"};
+    setRole(made, roles[static_cast<int>(role)]);
+    made->setFocusPolicy(Qt::TabFocus);
+    if (!icon.isEmpty())
+        setIcon(made, icon, role == Role::Main ? QColor(Qt::white) : role == Role::Danger ? Theme::Colour::Danger : Theme::Colour::Ink);
+    connect(made, &QPushButton::clicked, this, [clicked = std::move(clicked)] { clicked(); });
+    bind(name, made, caption);
+    return made;
+}
+
+QLabel* PageView::label(const QString& name, const Caption& caption, const char* type)
+{
+    QLabel* made = makeLabel(this, type);
+    bind(name, made, caption);
+    return made;
+}
+
+QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited)
+{
+    auto* made = new QLineEdit(this);
+    made->setProperty("ownRing", true); // its border tells
+    connect(made, &QLineEdit::textEdited, this, [edited = std::move(edited)](const QString& text) { edited(text); });
+    bind(name, made, caption);
+    return made;
+}
+
+QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked)
+{
+    auto* made = new QCheckBox(this);
+    made->setFocusPolicy(Qt::TabFocus);
+    connect(made, &QCheckBox::clicked, this, [clicked = std::move(clicked)](bool on) { clicked(on); });
+    bind(name, made, caption);
+    return made;
+}
+
+QComboBox* PageView::comboBox(const QString& name, const TextList& list, const Caption& caption,
+                              std::function<void(int)> activated)
+{
+    auto* made = new QComboBox(this);
+    made->setProperty("ownRing", true);
+    connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
+    bind(name, made, caption);
+    m_controls.back().list = &list;
+    return made;
+}
+
+void PageView::bind(const QString& name, QWidget* widget, const Caption& caption)
+{
+    widget->setObjectName(name);
+    m_controls.push_back({name, widget, &caption, nullptr, {}});
+}
+
+void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text)
+{
+    widget->setObjectName(name);
+    m_controls.push_back({name, widget, nullptr, nullptr, std::move(text)});
+}
+
+void PageView::bindHidden(const QString& name, const Caption& caption)
+{
+    m_controls.push_back({name, nullptr, &caption, nullptr, {}});
+}
+
+void PageView::bindList(const QString& name, const TextList& list, QWidget* widget)
+{
+    if (widget)
+        widget->setObjectName(name);
+    m_controls.push_back({name, widget, nullptr, &list, {}});
+}
+
+void PageView::setDirectedIcon(QPushButton* button, bool forwards)
+{
+    const bool right = forwards != (layoutDirection() == Qt::RightToLeft);
+    setIcon(button, right ? u"arrow-right"_s : u"arrow-left"_s,
+            button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
+}
+
+void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour)
+{
+    const int size = m_theme.px(24);
+    button->setIcon(m_theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
+    button->setIconSize({size, size});
+}
+
+void PageView::speak(QWidget* widget, const QString& text) const
+{
+    widget->setProperty("spoken", true);
+    widget->setAccessibleName(text);
+}
+
+} // namespace lumora
