@@ -5,6 +5,7 @@
 
 #include <QApplication>
 #include <QEvent>
+#include <QFrame>
 #include <QKeyEvent>
 #include <QPainter>
 #include <QVBoxLayout>

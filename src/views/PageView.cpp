@@ -143,7 +143,8 @@ void PageView::renderBindings()
         if (!control.caption)
             continue;
         const Caption& caption = *control.caption;
-        if (auto* check = qobject_cast<QCheckBox*>(widget)) {
+        // A checkable button is bound to nothing but a CheckCaption.
+        if (auto* check = qobject_cast<QAbstractButton*>(widget); check && check->isCheckable()) {
             const QSignalBlocker quiet(check);
             check->setChecked(static_cast<const CheckCaption&>(caption).checked);
         }
@@ -226,7 +227,10 @@ QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, 
 {
     auto* made = new QCheckBox(this);
     made->setFocusPolicy(Qt::TabFocus);
-    connect(made, &QCheckBox::clicked, this, [clicked = std::move(clicked)](bool on) { clicked(on); });
+    connect(made, &QCheckBox::clicked, this, [this, clicked = std::move(clicked)](bool on) {
+        clicked(on);
+        schedule();
+    });
     bind(name, made, caption);
     return made;
 }
@@ -246,6 +250,16 @@ void PageView::bind(const QString& name, QWidget* widget, const Caption& caption
 {
     widget->setObjectName(name);
     m_controls.push_back({name, widget, &caption, nullptr, {}});
+}
+
+void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked)
+{
+    button->setCheckable(true);
+    connect(button, &QAbstractButton::clicked, this, [this, clicked = std::move(clicked)] {
+        clicked();
+        schedule(); // the press has turned the mark over by itself; the page's word counts
+    });
+    bind(name, button, caption);
 }
 
 void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text)

@@ -48,6 +48,7 @@ public:
     void renderNow();
     // The page is gone or about to go: nothing of it is read from here on.
     void detach();
+    bool isDetached() const { return m_detached; }
     // Esc on the page itself.
     virtual void escape() {}
     // What has the keyboard when the page comes to the front.
@@ -77,6 +78,8 @@ protected:
 
     // Binds a widget of the view's own making.
     void bind(const QString& name, QWidget* widget, const Caption& caption);
+    // A button of the view's own making that can be chosen.
+    void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked);
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
     // What has a name and is not seen.
     void bindHidden(const QString& name, const Caption& caption);

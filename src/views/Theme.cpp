@@ -189,7 +189,8 @@ QToolTip { background: $Ink; color: white; border: none; padding: @6px @10px; }
         scaled += QString::number(px(match.capturedView(1).toInt()));
         from = match.capturedEnd();
     }
-    return scaled + QStringView(result).mid(from);
+    scaled += QStringView(result).mid(from);
+    return scaled;
 }
 
 void Theme::apply(QApplication& application)

@@ -1,0 +1,23 @@
+#pragma once
+
+#include "platform/Machine.h"
+
+namespace lumora {
+
+class Drives;
+
+// The desktop's own browser, file manager and clipboard.
+class DesktopShell : public Shell {
+public:
+    explicit DesktopShell(const Drives& drives)
+        : m_drives(drives) {}
+
+    void openWebPage(const QString& url) override;
+    void openFolder(const QString& drivePath) override;
+    void copyToClipboard(const QString& text) override;
+
+private:
+    const Drives& m_drives;
+};
+
+} // namespace lumora

@@ -1,0 +1,16 @@
+#pragma once
+
+namespace lumora {
+
+class Files;
+class MainWindow;
+class PageChain;
+struct Deployment;
+struct Platform;
+struct SessionState;
+
+// Which pages there are, and which view shows each.
+void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment);
+void registerViews(MainWindow& window, SessionState& state, const Files& files);
+
+} // namespace lumora

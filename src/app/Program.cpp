@@ -1,0 +1,139 @@
+#include "app/Program.h"
+
+#include "app/DesktopShell.h"
+#include "app/PageRegister.h"
+#include "platform/Drives.h"
+#include "platform/Files.h"
+#include "platform/Platform.h"
+#include "platform/PocoInternet.h"
+#include "platform/QtEventPump.h"
+#include "platform/StatVolume.h"
+#include "platform/SystemClock.h"
+#include "session/LabFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "views/MainWindow.h"
+#include "views/ScreenDialogs.h"
+
+#include <QCoreApplication>
+#include <QGuiApplication>
+#include <QScreen>
+#include <QTimer>
+
+#include <cassert>
+#include <cstdio>
+
+namespace lumora {
+
+// In the order in which each stands on those before it.
+struct Program::Parts {
+    Parts(Deployment read, const HostPath& dataFolder)
+        : deployment(std::move(read))
+        , drives(dataFolder, deployment.programLetter)
+        , files(drives)
+        , volume(drives)
+        , shell(drives)
+        , chain(pump)
+        , window(chain, state)
+        , dialogs(window, state, files)
+        , platform{files, dialogs, internet, shell, clock, pump, volume}
+    {
+    }
+
+    Deployment deployment;
+    SessionState state;
+    Drives drives;
+    Files files;
+    StatVolume volume;
+    SystemClock clock;
+    QtEventPump pump;
+    PocoInternet internet;
+    DesktopShell shell;
+    PageChain chain;
+    MainWindow window;
+    ScreenDialogs dialogs;
+    Platform platform;
+};
+
+Program::Program(ProgramOptions options)
+    : m_options(std::move(options))
+{
+}
+
+Program::~Program() = default;
+
+Result<void> Program::start()
+{
+    assert(!m_parts);
+    std::optional<HostPath> labFile = m_options.labFile;
+    if (!labFile)
+        labFile = FindLabFile(labFilePlaces(toHostPath(QCoreApplication::applicationDirPath())));
+    LabFileReading reading;
+    if (labFile)
+        reading = ReadLabFile(*labFile);
+    for (const QString& warning : reading.warnings)
+        std::fprintf(stderr, "lumora: %s\n", qPrintable(warning));
+    if (!reading.errors.isEmpty())
+        return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
+
+    HostPath dataFolder = Drives::defaultDataFolder();
+    if (m_options.dataFolder)
+        dataFolder = *m_options.dataFolder;
+    else if (!reading.deployment.dataFolder.isEmpty())
+        dataFolder = toHostPath(reading.deployment.dataFolder);
+    std::error_code error;
+    std::filesystem::create_directories(dataFolder, error);
+    if (error) {
+        return Failure{Failure::Kind::AccessDenied,
+                       QStringLiteral("%1: the data folder can't be made: %2")
+                           .arg(toText(dataFolder), QString::fromStdString(error.message()))};
+    }
+    std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
+
+    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder);
+    Parts& parts = *m_parts;
+    registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
+    registerViews(parts.window, parts.state, parts.files);
+    // The process ends with the event loop, which may be one of a question: each of them has to come back.
+    QObject::connect(&parts.chain, &PageChain::ended, qApp, [] { QCoreApplication::exit(0); }, Qt::QueuedConnection);
+
+    QSize size = m_options.windowSize;
+    if (size.isEmpty()) {
+        const QScreen* screen = QGuiApplication::primaryScreen();
+        size = screen ? screen->availableSize().boundedTo({1280, 960}) : QSize(1024, 768);
+    }
+    parts.window.resize(size);
+    parts.chain.show(PageId::hatchala);
+    if (m_options.fullScreen)
+        parts.window.showFullScreen();
+    else
+        parts.window.show();
+    return {};
+}
+
+SessionState& Program::state()
+{
+    return m_parts->state;
+}
+
+PageChain& Program::chain()
+{
+    return m_parts->chain;
+}
+
+MainWindow& Program::window()
+{
+    return m_parts->window;
+}
+
+ScreenDialogs& Program::dialogs()
+{
+    return m_parts->dialogs;
+}
+
+const Platform& Program::platform() const
+{
+    return m_parts->platform;
+}
+
+} // namespace lumora

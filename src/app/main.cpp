@@ -1,0 +1,48 @@
+#include "app/Program.h"
+#include "views/Application.h"
+#include "views/StartFailure.h"
+
+#include <QCommandLineParser>
+
+#include <cstdio>
+
+using namespace lumora;
+
+int main(int argc, char** argv)
+{
+    Application application(argc, argv);
+    Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
+    QCommandLineParser parser;
+    parser.setApplicationDescription(QStringLiteral("Orders prints from a photo lab."));
+    const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Show this help and end."));
+    const QCommandLineOption version({QStringLiteral("v"), QStringLiteral("version")}, QStringLiteral("Show the version and end."));
+    const QCommandLineOption lab(QStringLiteral("lab"), QStringLiteral("Read the lab's settings from FILE."), QStringLiteral("FILE"));
+    const QCommandLineOption window(QStringLiteral("window"), QStringLiteral("Run in a window, not over the whole screen."));
+    parser.addOptions({help, version, lab, window});
+    if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
+        std::fprintf(stderr, "lumora: %s\n", qPrintable(parser.errorText().isEmpty()
+                                                            ? QStringLiteral("unexpected argument '%1'").arg(parser.positionalArguments().first())
+                                                            : parser.errorText()));
+        return 2;
+    }
+    if (parser.isSet(help)) {
+        std::fputs(qPrintable(parser.helpText()), stdout);
+        return 0;
+    }
+    if (parser.isSet(version)) {
+        std::puts("lumora " LUMORA_VERSION);
+        return 0;
+    }
+
+    ProgramOptions options;
+    if (parser.isSet(lab))
+        options.labFile = toHostPath(parser.value(lab));
+    options.fullScreen = !parser.isSet(window);
+    Program program(std::move(options));
+    if (const Result<void> started = program.start(); !started) {
+        std::fprintf(stderr, "lumora: %s\n", qPrintable(started.failure().message));
+        showStartFailure(started.failure().message);
+        return 2;
+    }
+    return QCoreApplication::exec();
+}

@@ -1,0 +1,10 @@
+#pragma once
+
+#include <QString>
+
+namespace lumora {
+
+// A window of its own that tells why the program can't start, until the person closes it. Where no screen is, nothing.
+void showStartFailure(const QString& text);
+
+} // namespace lumora
