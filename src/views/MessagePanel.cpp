@@ -30,7 +30,7 @@ MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const
         words->addWidget(head);
     }
     auto* body = makeLabel(this, title.isEmpty() ? "strong" : "body");
-    body->setText(isolated(QString(text).replace(QLatin1Char('\r'), QLatin1Char('\n')).trimmed()));
+    body->setText(isolated(text.trimmed()));
     body->setObjectName(QStringLiteral("messageText"));
     body->setAlignment(Qt::AlignLeading | Qt::AlignVCenter);
     words->addWidget(body);

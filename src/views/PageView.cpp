@@ -47,7 +47,7 @@ void fillCombo(QComboBox& box, const TextList& list, const Caption& caption)
         box.setCurrentIndex(row);
 }
 
-void fillList(QListWidget& widget, const TextList& list)
+void fillList(QListWidget& widget, const TextList& list, const std::function<QString(const QString&)>& shown)
 {
     const QSignalBlocker quiet(widget);
     bool same = widget.count() == list.count();
@@ -56,7 +56,7 @@ void fillList(QListWidget& widget, const TextList& list)
     if (!same) {
         widget.clear();
         for (const QString& item : list.items()) {
-            auto* row = new QListWidgetItem(isolated(item.trimmed()), &widget);
+            auto* row = new QListWidgetItem(isolated(shown ? shown(item) : item.trimmed()), &widget);
             row->setData(Qt::UserRole, item);
         }
     }
@@ -136,7 +136,7 @@ void PageView::renderBindings()
             continue;
         if (control.list) {
             if (auto* list = qobject_cast<QListWidget*>(widget))
-                fillList(*list, *control.list);
+                fillList(*list, *control.list, control.row);
             else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
                 fillCombo(*box, *control.list, *control.caption);
         }
@@ -273,11 +273,11 @@ void PageView::bindHidden(const QString& name, const Caption& caption)
     m_controls.push_back({name, nullptr, &caption, nullptr, {}});
 }
 
-void PageView::bindList(const QString& name, const TextList& list, QWidget* widget)
+void PageView::bindList(const QString& name, const TextList& list, QWidget* widget, std::function<QString(const QString&)> row)
 {
     if (widget)
         widget->setObjectName(name);
-    m_controls.push_back({name, widget, nullptr, &list, {}});
+    m_controls.push_back({name, widget, nullptr, &list, {}, std::move(row)});
 }
 
 void PageView::setDirectedIcon(QPushButton* button, bool forwards)

@@ -41,6 +41,7 @@ public:
         const Caption* caption = nullptr; // one of the two tells what the control says
         const TextList* list = nullptr;
         std::function<QString()> text;    // in place of the caption's
+        std::function<QString(const QString&)> row = {}; // what a person reads of a row of the list
     };
     const Control* control(const QString& name) const;
 
@@ -83,7 +84,8 @@ protected:
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
     // What has a name and is not seen.
     void bindHidden(const QString& name, const Caption& caption);
-    void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr);
+    void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr,
+                  std::function<QString(const QString&)> row = {});
     // The icon of a button that points forwards or backwards along the reading direction.
     void setDirectedIcon(QPushButton* button, bool forwards);
 

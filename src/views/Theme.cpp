@@ -221,8 +221,9 @@ QString isolated(const QString& text)
     static const QRegularExpression ownDirection(
         u"[A-Za-z]:\\\\[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+|\\d+(?:\\s*[/x:.,_-]\\s*\\d+)+\\s?%?|\\d+\\s?%|\\+\\d+"_s);
     QString result = text;
+    result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     qsizetype shift = 0;
-    for (auto it = ownDirection.globalMatch(text); it.hasNext();) {
+    for (auto it = ownDirection.globalMatch(result); it.hasNext();) {
         const auto match = it.next();
         result.insert(match.capturedStart() + shift, QChar(0x2066));
         result.insert(match.capturedEnd() + shift + 1, QChar(0x2069));

@@ -1,0 +1,58 @@
+#include "app/PageRegister.h"
+
+#include "assembly/Form2.h"
+#include "editing/gdisave.h"
+#include "entry/Havharot.h"
+#include "entry/nnn.h"
+#include "platform/Platform.h"
+#include "selection/kyoskNew.h"
+#include "session/PageChain.h"
+#include "session/hatchala.h"
+#include "transfer/FtpFrm.h"
+#include "transfer/InetForm.h"
+#include "views/Form2View.h"
+#include "views/FtpFrmView.h"
+#include "views/HavharotView.h"
+#include "views/MainWindow.h"
+#include "views/hatchalaView.h"
+#include "views/kyoskNewView.h"
+#include "views/nnnView.h"
+
+namespace lumora {
+
+void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment)
+{
+    chain.registerPage(PageId::hatchala, [&] { return std::make_unique<hatchala>(state, platform, chain, deployment); });
+    chain.registerPage(PageId::nnn, [&] { return std::make_unique<nnn>(state, platform, chain); });
+    chain.registerPage(PageId::Havharot, [&] { return std::make_unique<Havharot>(state, platform, chain); });
+    chain.registerPage(PageId::kyoskNew, [&] { return std::make_unique<kyoskNew>(state, platform, chain); });
+    chain.registerPage(PageId::gdisave, [&] { return std::make_unique<gdisave>(state, platform, chain); });
+    chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
+    chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
+    chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
+}
+
+void registerViews(MainWindow& window, SessionState& state, const Files& files)
+{
+    // A view is made for the page that its id stands for, so the page is of that class.
+    window.registerView(PageId::hatchala, [&](Page& page, const Theme& theme) {
+        return std::make_unique<hatchalaView>(static_cast<hatchala&>(page), state, theme, files);
+    });
+    window.registerView(PageId::nnn, [&](Page& page, const Theme& theme) {
+        return std::make_unique<nnnView>(static_cast<nnn&>(page), state, theme);
+    });
+    window.registerView(PageId::Havharot, [&](Page& page, const Theme& theme) {
+        return std::make_unique<HavharotView>(static_cast<Havharot&>(page), state, theme);
+    });
+    window.registerView(PageId::kyoskNew, [&](Page& page, const Theme& theme) {
+        return std::make_unique<kyoskNewView>(static_cast<kyoskNew&>(page), state, theme);
+    });
+    window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
+        return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);
+    });
+    window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
+        return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);
+    });
+}
+
+} // namespace lumora

@@ -1,0 +1,332 @@
+#include "views/FtpFrmView.h"
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "imaging/PictureFile.h"
+#include "views/Cards.h"
+#include "views/Gauge.h"
+#include "views/Overlay.h"
+
+#include <QGridLayout>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QListWidget>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// The count begins there; the ring is full then.
+constexpr double countdownFrom = 15;
+
+} // namespace
+
+FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files)
+    : PageView(page, state, theme)
+    , m_page(page)
+    , m_files(files)
+{
+    frame().steps().setStep(OrderStep::Sending);
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme.px(28));
+    row->addWidget(makeProgress(), 3);
+    row->addWidget(makeSide(), 2);
+    frame().content()->addLayout(row, 1);
+    makeBars();
+    makePanels();
+    bindTheRest();
+    start();
+}
+
+QWidget* FtpFrmView::makeProgress()
+{
+    auto* box = new QWidget(this);
+    auto* column = new QVBoxLayout(box);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme().px(10));
+    column->addStretch(1);
+    m_gauge = new Gauge(theme(), box);
+    column->addWidget(m_gauge, 6, Qt::AlignCenter);
+    const auto line = [&](const QString& name, const Caption& caption, const char* type) {
+        auto* made = label(name, caption, type);
+        made->setAlignment(Qt::AlignCenter);
+        column->addWidget(made);
+        return made;
+    };
+    line(u"Label3"_s, m_page.Label3, "title");
+    line(u"Label4File"_s, m_page.Label4File, "muted");
+    line(u"Label34"_s, m_page.Label34, "strong");
+    auto* minutes = new QHBoxLayout;
+    minutes->addStretch(1);
+    minutes->addWidget(label(u"Label4DiffTitle"_s, m_page.Label4DiffTitle, "muted"));
+    minutes->addWidget(label(u"Label4Diff"_s, m_page.Label4Diff, "strong"));
+    minutes->addStretch(1);
+    column->addLayout(minutes);
+    line(u"Label4Do"_s, m_page.Label4Do, "body");
+    column->addStretch(1);
+
+    const auto notice = [&](const char* role, const QString& icon, QColor colour) {
+        auto* made = new QFrame(box);
+        setRole(made, role);
+        auto* inside = new QHBoxLayout(made);
+        inside->setContentsMargins(theme().px(20), theme().px(14), theme().px(20), theme().px(14));
+        inside->setSpacing(theme().px(16));
+        auto* sign = new QLabel(made);
+        sign->setPixmap(theme().icon(icon, theme().px(36), colour));
+        inside->addWidget(sign, 0, Qt::AlignTop);
+        auto* words = new QVBoxLayout;
+        words->setSpacing(theme().px(4));
+        inside->addLayout(words, 1);
+        column->addWidget(made);
+        return std::pair(made, words);
+    };
+    const auto [failure, failureWords] = notice("alarm", u"warning"_s, Theme::Colour::Danger);
+    m_failure = failure;
+    m_failureLine = makeLabel(failure, "strong");
+    failureWords->addWidget(m_failureLine);
+    failureWords->addWidget(label(u"Label2"_s, m_page.Label2));
+    failureWords->addWidget(label(u"Label4Reason"_s, m_page.Label4Reason));
+    failureWords->addWidget(label(u"Label9"_s, m_page.Label9));
+    bind(u"Picture6"_s, m_failureLine, [this] { return m_failureLine->text(); });
+    return box;
+}
+
+QWidget* FtpFrmView::makeSide()
+{
+    auto* box = new QWidget(this);
+    auto* column = new QVBoxLayout(box);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme().px(14));
+    const auto card = [&](const char* role) {
+        auto* made = new QFrame(box);
+        setRole(made, role);
+        auto* inside = new QVBoxLayout(made);
+        inside->setContentsMargins(theme().px(22), theme().px(18), theme().px(22), theme().px(18));
+        inside->setSpacing(theme().px(8));
+        column->addWidget(made);
+        return std::pair(made, inside);
+    };
+    const auto [order, orderLines] = card("card");
+    m_order = order;
+    m_orderHead = makeLabel(order, "smallMuted");
+    orderLines->addWidget(m_orderHead);
+    m_orderName = makeLabel(order, "strong");
+    bind(u"Label46"_s, m_orderName, [this] { return m_page.Label46.text; });
+    orderLines->addWidget(m_orderName);
+    m_counts = makeLabel(order, "body");
+    orderLines->addWidget(m_counts);
+    orderLines->addWidget(button(u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s), 0,
+                          Qt::AlignLeading);
+
+    const auto [delivery, deliveryLines] = card("notice");
+    m_delivery = delivery;
+    deliveryLines->addWidget(label(u"Label15"_s, m_page.Label15, "strong"));
+    deliveryLines->addWidget(label(u"Label4Ktovet"_s, m_page.Label4Ktovet));
+
+    const auto [summary, summaryColumn] = card("card");
+    m_summary = summary;
+    auto* head = new QHBoxLayout;
+    auto* sign = new QLabel(summary);
+    sign->setPixmap(theme().icon(u"document"_s, theme().px(28), Theme::Colour::Primary));
+    head->addWidget(sign);
+    m_successLine = makeLabel(summary, "large");
+    head->addWidget(m_successLine, 1);
+    summaryColumn->addLayout(head);
+    m_summaryLines = makeLabel(summary, "body");
+    bind(u"Picture2"_s, m_summaryLines, [this] { return m_page.Picture2Lines.join(u'\n'); });
+    summaryColumn->addWidget(m_summaryLines);
+
+    m_proof = new PictureBox(theme(), box);
+    m_proof->setMinimumHeight(theme().px(120));
+    bind(u"Picture13"_s, m_proof, m_page.Picture13);
+    column->addWidget(m_proof, 1);
+    column->addStretch(1);
+    auto* fault = button(u"Command22"_s, m_page.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
+    column->addWidget(fault, 0, Qt::AlignLeading);
+    column->addWidget(button(u"Command24"_s, m_page.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s), 0,
+                      Qt::AlignLeading);
+    return box;
+}
+
+void FtpFrmView::makeBars()
+{
+    frame().addHeaderAction(button(u"Image3"_s, m_page.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
+    m_exit = button(u"Command11"_s, m_page.Command11, Role::Secondary, [this] { m_page.Command11_Click(); });
+    frame().addSecondaryAction(m_exit);
+    m_stop = button(u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"stop"_s);
+    frame().addSecondaryAction(m_stop);
+    m_count = button(u"Command23"_s, m_page.Command23, Role::Secondary, [this] { m_page.Command23_Click(); }, u"pause"_s);
+    frame().addSecondaryAction(m_count);
+    m_status = makeLabel(this, "large");
+    m_status->setWordWrap(false);
+    bind(u"Label21"_s, m_status, [this] { return m_page.Label21.text; });
+    frame().addStatus(m_status);
+    m_sendAgain = button(u"Command10"_s, m_page.Command10, Role::Main, [this] { m_page.Command10_Click(); });
+    m_sendNow = button(u"Image5"_s, m_page.Image5, Role::Main, [this] { m_page.Image5_Click(); });
+    m_newOrder = button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); });
+    frame().addMainAction(m_newOrder);
+    frame().addMainAction(m_sendAgain);
+    frame().addMainAction(m_sendNow);
+}
+
+void FtpFrmView::makePanels()
+{
+    m_leave = new Overlay(theme(), this);
+    m_leaveText = label(u"Picture7"_s, m_page.Picture7, "large");
+    m_leave->column()->addWidget(m_leaveText);
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme().gap());
+    row->addWidget(button(u"Command16"_s, m_page.Command16, Role::Danger, [this] { m_page.Command16_Click(); }));
+    row->addStretch(1);
+    auto* stay = button(u"Command14"_s, m_page.Command14, Role::Main, [this] { m_page.Command14_Click(); });
+    row->addWidget(stay);
+    m_leave->column()->addLayout(row);
+    m_leave->setCardWidth(760);
+    m_leave->setFirstFocus(stay);
+    connect(m_leave, &Overlay::escaped, this, [this] { m_page.Command14_Click(); });
+
+    // For the lab's own people: the lists of the sending and its manual steps.
+    m_hiddenArea = new Overlay(theme(), this);
+    m_hiddenArea->setFilling();
+    auto* lists = new QGridLayout;
+    lists->setSpacing(theme().px(8));
+    const auto show = [&](int column, const QString& name, const TextList& list, const QString& hebrew, const QString& english) {
+        auto* title = makeLabel(m_hiddenArea, "smallMuted");
+        auto* widget = new QListWidget(m_hiddenArea);
+        widget->setFocusPolicy(Qt::NoFocus);
+        bindList(name, list, widget, [](const QString& item) { return item.contains(u'\\') ? LeafName(item) : item; });
+        lists->addWidget(title, 0, column);
+        lists->addWidget(widget, 1, column);
+        m_listTitles.push_back({title, {hebrew, english}});
+    };
+    show(0, u"List3"_s, m_page.List3, u"קבצים לשליחה"_s, u"Files to be sent"_s);
+    show(1, u"List6"_s, m_page.List6, u"נמצאים בשרת"_s, u"On the server"_s);
+    show(2, u"List7"_s, m_page.List7, u"שליחה שנכשלה"_s, u"Failed"_s);
+    show(3, u"LogList"_s, m_page.LogList, u"יומן"_s, u"Log"_s);
+    m_hiddenArea->column()->addLayout(lists, 1);
+    auto* manual = new QGridLayout;
+    manual->setSpacing(theme().px(8));
+    int at = 0;
+    const auto add = [&](const QString& name, const Caption& caption, void (FtpFrm::*handler)()) {
+        manual->addWidget(button(name, caption, Role::Plain, [this, handler] { (m_page.*handler)(); }), at / 5, at % 5);
+        ++at;
+    };
+    add(u"Command13"_s, m_page.Command13, &FtpFrm::Command13_Click);
+    add(u"Command1"_s, m_page.Command1, &FtpFrm::Command1_Click);
+    add(u"Command2"_s, m_page.Command2, &FtpFrm::Command2_Click);
+    add(u"Command4"_s, m_page.Command4, &FtpFrm::Command4_Click);
+    add(u"Command17"_s, m_page.Command17, &FtpFrm::Command17_Click);
+    add(u"Command19"_s, m_page.Command19, &FtpFrm::Command19_Click);
+    add(u"Command25"_s, m_page.Command25, &FtpFrm::Command25_Click);
+    m_hiddenArea->column()->addLayout(manual);
+    auto* close = button(u"Command9"_s, m_page.Command9, Role::Main, [this] { m_page.Command9_Click(); });
+    m_hiddenArea->column()->addWidget(close, 0, Qt::AlignTrailing);
+    m_hiddenArea->setFirstFocus(close);
+    connect(m_hiddenArea, &Overlay::escaped, this, [this] { m_page.Command9_Click(); });
+}
+
+void FtpFrmView::bindTheRest()
+{
+    const std::pair<const char*, const Caption*> captions[] = {
+        {"Label7", &m_page.Label7}, {"Label20", &m_page.Label20}, {"Label33", &m_page.Label33}, {"LabelProg", &m_page.LabelProg},
+        {"Label4Nichshal", &m_page.Label4Nichshal}, {"Label31", &m_page.Label31}, {"Label4Missing", &m_page.Label4Missing},
+        {"Label4Mitoch", &m_page.Label4Mitoch}, {"Label12", &m_page.Label12}, {"Label4Yooadoo", &m_page.Label4Yooadoo},
+        {"Label4Hamtana", &m_page.Label4Hamtana}, {"Label4siem", &m_page.Label4siem}, {"Command12", &m_page.Command12},
+        {"Command18", &m_page.Command18}, {"Command21", &m_page.Command21}, {"Command8", &m_page.Command8},
+        {"Image6", &m_page.Image6}, {"Image10", &m_page.Image10}, {"Image11", &m_page.Image11}, {"Frame9", &m_page.Frame9},
+        {"Label4", &m_page.Label4}, {"Frame2", &m_page.Frame2}};
+    for (const auto& [name, caption] : captions)
+        bindHidden(QString::fromLatin1(name), *caption);
+    const std::pair<const char*, const TextList*> lists[] = {
+        {"List1", &m_page.List1}, {"List2", &m_page.List2}, {"List4", &m_page.List4}, {"List5", &m_page.List5},
+        {"List8", &m_page.List8}, {"List9", &m_page.List9}, {"List4Makor", &m_page.List4Makor},
+        {"List4Broken", &m_page.List4Broken}, {"List4BrokenB", &m_page.List4BrokenB},
+        {"ListRezefFiles", &m_page.ListRezefFiles}, {"List4Tikiyot", &m_page.List4Tikiyot}};
+    for (const auto& [name, list] : lists)
+        bindList(QString::fromLatin1(name), *list);
+}
+
+QWidget* FtpFrmView::firstFocus() const
+{
+    return m_sendNow;
+}
+
+void FtpFrmView::render()
+{
+    const bool done = m_page.AllDone == 1;
+    const bool counting = m_page.Timer1.running();
+    const bool failed = !done && !m_page.sending && (m_page.Picture6.visible || m_page.Command10.visible);
+    frame().steps().setStep(done ? OrderStep::Done : OrderStep::Sending);
+    frame().setTitle(done       ? wording(u"ההזמנה נשלחה"_s, u"Your order was sent"_s)
+                     : failed   ? wording(u"השליחה לא הושלמה"_s, u"The sending is not complete"_s)
+                     : counting ? wording(u"ההזמנה מוכנה לשליחה"_s, u"Your order is ready to be sent"_s)
+                                : wording(u"שליחת ההזמנה"_s, u"Sending your order"_s));
+    if (done)
+        m_gauge->showSign(Gauge::Mood::Good);
+    else if (failed)
+        m_gauge->showSign(Gauge::Mood::Bad);
+    else if (m_page.sending)
+        m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
+    else
+        m_gauge->show(Val(m_page.Label33.text) / countdownFrom, m_page.Label33.text.trimmed(), wording(u"שניות"_s, u"seconds"_s));
+    m_gauge->setAccessibleName(m_page.sending ? m_page.LabelProg.text : m_page.Label4Do.text);
+
+    m_failure->setVisible(failed && (m_page.Picture6.visible || m_page.Label4Reason.visible));
+    const auto join = [](std::initializer_list<const Caption*> parts) {
+        QStringList words;
+        for (const Caption* part : parts)
+            words += part->text.trimmed();
+        return words.join(u' ');
+    };
+    m_failureLine->setText(isolated(join({&m_page.Label4Nichshal, &m_page.Label4Missing, &m_page.Label4Mitoch, &m_page.Label12,
+                                          &m_page.Label4Yooadoo})));
+    m_failureLine->setVisible(m_page.Picture6.visible);
+
+    m_orderHead->setText(wording(u"ההזמנה שלך"_s, u"Your order"_s));
+    // Folder names hold underscores and no blanks: they may break behind one.
+    m_orderName->setText(QChar(0x2066) + QString(m_page.Label46.text).replace(u'_', u"_\u200B"_s) + QChar(0x2069));
+    m_counts->setText(isolated(wording(u"%1 תמונות, %2 קבצים"_s, u"%1 prints, %2 files"_s).arg(m_page.Label21.text.trimmed(), m_page.Label7.text.trimmed())));
+    m_counts->setVisible(!m_page.Label21.text.trimmed().isEmpty());
+    m_order->setVisible(!done);
+    m_delivery->setVisible(m_page.Label15.visible);
+    m_summary->setVisible(m_page.Picture2.visible);
+    m_successLine->setText(wording(u"סיכום ההזמנה"_s, u"Summary of your order"_s));
+    QStringList lines;
+    for (const QString& line : m_page.Picture2Lines) {
+        if (!line.trimmed().isEmpty())
+            lines += isolated(line.trimmed());
+    }
+    m_summaryLines->setText(lines.join(u'\n'));
+    if (m_proofFile != m_page.Picture13File) {
+        m_proofFile = m_page.Picture13File;
+        QImage picture;
+        if (const auto path = m_files.drives().toHost(m_proofFile)) {
+            if (const auto loaded = loadPicture(*path))
+                picture = loaded->image();
+        }
+        m_proof->setPicture(picture);
+    }
+
+    const QString total = m_page.Label21.text.trimmed();
+    m_status->setText(total.isEmpty() ? QString() : wording(u"תמונות בהזמנה: %1"_s, u"Prints in this order: %1"_s).arg(total));
+    // One main action at a time; the others that the page allows stand beside it or wait.
+    m_sendNow->setVisible(m_page.Image5.visible && !failed && !done && !m_page.sending);
+    m_sendAgain->setVisible(m_page.Command10.visible && failed);
+    setRole(m_newOrder, done ? "main" : "secondary");
+    m_newOrder->setStyleSheet(m_newOrder->styleSheet());
+    m_newOrder->setVisible(m_page.Command28.visible);
+    m_stop->setVisible(m_page.Command15.visible && m_page.sending);
+    m_count->setVisible(m_page.Command23.visible && !m_page.sending && !failed && !done);
+    setIcon(m_count, counting ? u"pause"_s : u"play"_s, Theme::Colour::Ink);
+    m_exit->setVisible(done && m_page.Command11.visible);
+    for (const auto& [label, texts] : m_listTitles)
+        label->setText(wording(texts.first, texts.second));
+    m_leave->setOpen(m_page.Picture7.visible);
+    m_hiddenArea->setOpen(m_page.Frame2.visible);
+}
+
+} // namespace lumora

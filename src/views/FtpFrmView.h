@@ -1,0 +1,58 @@
+#pragma once
+
+#include "transfer/FtpFrm.h"
+#include "views/PageView.h"
+
+class QFrame;
+
+namespace lumora {
+
+class Gauge;
+class PictureBox;
+
+class FtpFrmView : public PageView {
+    Q_OBJECT
+public:
+    FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files);
+    QWidget* firstFocus() const override;
+
+protected:
+    void render() override;
+
+private:
+    QWidget* makeProgress();
+    QWidget* makeSide();
+    void makeBars();
+    void makePanels();
+    void bindTheRest();
+
+    FtpFrm& m_page;
+    const Files& m_files;
+    Gauge* m_gauge = nullptr;
+    QFrame* m_failure = nullptr;
+    QLabel* m_failureLine = nullptr;
+    QFrame* m_success = nullptr;
+    QLabel* m_successLine = nullptr;
+    QFrame* m_summary = nullptr;
+    QLabel* m_summaryLines = nullptr;
+    QFrame* m_order = nullptr;
+    QLabel* m_orderHead = nullptr;
+    QLabel* m_orderName = nullptr;
+    QLabel* m_counts = nullptr;
+    QFrame* m_delivery = nullptr;
+    PictureBox* m_proof = nullptr;
+    QString m_proofFile;
+    QPushButton* m_sendNow = nullptr;
+    QPushButton* m_sendAgain = nullptr;
+    QPushButton* m_newOrder = nullptr;
+    QPushButton* m_stop = nullptr;
+    QPushButton* m_count = nullptr;
+    QPushButton* m_exit = nullptr;
+    QLabel* m_status = nullptr;
+    Overlay* m_leave = nullptr;
+    QLabel* m_leaveText = nullptr;
+    Overlay* m_hiddenArea = nullptr;
+    std::vector<std::pair<QLabel*, std::pair<QString, QString>>> m_listTitles;
+};
+
+} // namespace lumora

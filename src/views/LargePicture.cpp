@@ -1,0 +1,67 @@
+#include "views/LargePicture.h"
+
+#include <QPainter>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+LargePicture::LargePicture(const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , m_theme(theme)
+{
+    setMinimumSize(theme.px(180), theme.px(120));
+}
+
+void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning)
+{
+    m_view = view;
+    m_warning = warning;
+    setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified() : view.warning ? warning : u" "_s.trimmed());
+    update();
+}
+
+void LargePicture::paintEvent(QPaintEvent*)
+{
+    if (!m_view.visible)
+        return;
+    QPainter painter(this);
+    painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
+    if (m_view.bitmap.isNull()) {
+        QStringList lines;
+        for (const QString& line : m_view.guide) {
+            const QString words = line.trimmed();
+            // A row of arrows pointed to the small pictures; here the page's own layout does.
+            if (!words.isEmpty() && words != QString(words.size(), u'<'))
+                lines += words;
+        }
+        const int size = m_theme.px(44);
+        painter.drawPixmap(QPoint((width() - size) / 2, m_theme.px(10)), m_theme.icon(u"info"_s, size, Theme::Colour::Primary));
+        painter.setFont(m_theme.font(Theme::Type::Body));
+        painter.setPen(Theme::Colour::Ink);
+        painter.setLayoutDirection(layoutDirection());
+        painter.drawText(rect().adjusted(0, size + m_theme.px(20), 0, 0), Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap, lines.join(u"\n"_s));
+        return;
+    }
+    const QImage& picture = m_view.bitmap.image();
+    const QSizeF fit = QSizeF(picture.size()).scaled(size(), Qt::KeepAspectRatio);
+    QRectF at(QPointF(), fit);
+    at.moveCenter(QRectF(rect()).center());
+    painter.drawImage(at, picture);
+    if (!m_view.warning)
+        return;
+    painter.setFont(m_theme.font(Theme::Type::Small));
+    const int icon = m_theme.px(22);
+    const QRectF room(at.left(), at.top(), at.width(), m_theme.px(48));
+    painter.fillRect(room, QColor(0xFD, 0xF0, 0xD9, 235));
+    const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
+    painter.drawPixmap(QPointF(rightToLeft ? room.right() - icon - m_theme.px(8) : room.left() + m_theme.px(8), room.center().y() - icon / 2.0),
+                       m_theme.icon(u"warning"_s, icon, Theme::Colour::Danger));
+    painter.setPen(Theme::Colour::Ink);
+    painter.setLayoutDirection(layoutDirection());
+    const int beside = icon + m_theme.px(14);
+    painter.drawText(room.adjusted(rightToLeft ? m_theme.px(6) : beside, 0, rightToLeft ? -beside : -m_theme.px(6), 0),
+                     Qt::AlignVCenter | Qt::AlignLeading | Qt::TextWordWrap, m_warning);
+}
+
+} // namespace lumora
