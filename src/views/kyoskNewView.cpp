@@ -56,6 +56,7 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     makeBranchPanel();
     makeCompressionPanel();
     bindTheRest();
+    m_focusRequest = page.focusRequest;
     start();
 }
 
@@ -496,10 +497,10 @@ void kyoskNewView::renderClosing()
 
 void kyoskNewView::takeFocus()
 {
-    if (m_page.focus.isEmpty())
+    if (m_focusRequest == m_page.focusRequest)
         return;
-    const QString name = std::exchange(m_page.focus, QString());
-    if (auto* widget = findChild<QWidget*>(name))
+    m_focusRequest = m_page.focusRequest;
+    if (auto* widget = findChild<QWidget*>(m_page.focusBox))
         widget->setFocus(Qt::OtherFocusReason);
 }
 

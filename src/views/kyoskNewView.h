@@ -76,6 +76,7 @@ private:
     QLabel* m_branchHead = nullptr;
     std::array<QPushButton*, 11> m_branchButtons{};
     Overlay* m_compression = nullptr;
+    int m_focusRequest = 0;
 };
 
 } // namespace lumora
