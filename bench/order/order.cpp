@@ -166,7 +166,7 @@ int peakMemory(int pictures) {
     int last = 0;
     const Times times = bench.order(pictures, [&](const Form2& page) {
         const int at = page.Label17.text.toInt();
-        if (at != last && at % (pictures / 6) == 0)
+        if (at != last && at > 0 && at % std::max(1, pictures / 6) == 0)
             std::printf("picture %3d: %.0f MiB, most %.0f\n", at, memory("VmRSS:"), memory("VmHWM:"));
         last = at;
     });

@@ -92,7 +92,6 @@ private:
     enum class Phase { NoOrder, Countdown, Waiting, Sending, Checking, Success, NotAll, Stopped, Silent };
 
     // FtpFrm.cpp
-    void activateWhenFree();
     void setButtonTexts();
     void setPanelTexts();
     void showWhatToDo();
