@@ -34,7 +34,8 @@ QString line(int copies, const QString& path, LineForm form) {
 Basket fullBasket(LineForm form) {
     Basket basket;
     basket.setForm(form);
-    for (const QString& path : foundPictures().paths().items())
+    const FolderPager found = foundPictures();
+    for (const QString& path : found.paths().items())
         basket.append(line(1, path, form));
     return basket;
 }
@@ -78,7 +79,7 @@ void PlusOnTheLastPicture(benchmark::State& state) {
     }
 }
 
-// Removing a line moves all lines behind it, so that the next search has to learn their places anew.
+// Removing a line moves all lines behind it.
 void MinusAndChoiceOfTheFirstPicture(benchmark::State& state) {
     Basket basket = fullBasket(formOf(state));
     for (auto _ : state) {

@@ -31,19 +31,22 @@ int Basket::FindByPath9(const QString& path) const {
 int Basket::FindByPath(const QString& path) const {
     if (!m_indexed)
         indexAll();
-    return m_byPath.value(path, -1);
+    const auto found = m_byPath.constFind(path);
+    if (found == m_byPath.cend())
+        return -1;
+    return static_cast<int>(std::lower_bound(m_ids.begin(), m_ids.end(), *found) - m_ids.begin());
 }
 
 void Basket::clear() {
     m_lines.clear();
     m_copies = 0;
-    m_byPath.clear();
-    m_indexed = true;
-    m_indexClosed = false;
+    m_ids.clear();
+    indexAll();
 }
 
 void Basket::append(const QString& line) {
     m_lines.append(line);
+    m_ids.push_back(m_nextId++);
     m_copies += PrintCode::copiesOf(line);
     if (m_indexed)
         addToIndex(m_lines.lastIndex());
@@ -65,7 +68,11 @@ void Basket::removeAt(int index) {
     const QString old = m_lines.item(index);
     m_copies -= PrintCode::copiesOf(old);
     m_lines.removeAt(index);
-    m_indexed = false;
+    m_ids.erase(m_ids.begin() + index);
+    if (m_unique && !m_indexClosed)
+        m_byPath.remove(pathOf(old));
+    else
+        m_indexed = false;
 }
 
 int Basket::SumCopies() const {
@@ -91,13 +98,16 @@ void Basket::addToIndex(int index) const {
     if (m_indexClosed)
         return;
     const QString path = pathOf(line);
-    if (!m_byPath.contains(path))
-        m_byPath.insert(path, index);
+    if (m_byPath.contains(path))
+        m_unique = false;
+    else
+        m_byPath.insert(path, m_ids[static_cast<std::size_t>(index)]);
 }
 
 void Basket::indexAll() const {
     m_byPath.clear();
     m_indexed = true;
+    m_unique = true;
     m_indexClosed = false;
     for (int i = 0; i < count(); ++i)
         addToIndex(i);

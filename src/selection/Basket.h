@@ -5,6 +5,8 @@
 
 #include <QHash>
 
+#include <vector>
+
 namespace lumora {
 
 // The basket: lines in the order of first choice, a replaced line stays in its place. A picture stands in it once,
@@ -51,8 +53,13 @@ private:
     LineForm m_form = LineForm::Short;
     TextList m_lines;
     long long m_copies = 0;
-    mutable QHash<QString, int> m_byPath; // the first line of each path
+    // Each line keeps a number of its own, rising through the list, so that a path leads to its line also when lines
+    // before it were removed.
+    std::vector<unsigned> m_ids;
+    unsigned m_nextId = 0;
+    mutable QHash<QString, unsigned> m_byPath; // the number of the first line of each path
     mutable bool m_indexed = true;
+    mutable bool m_unique = true;       // no path stands twice
     mutable bool m_indexClosed = false; // a line that is too short stands before what follows
 };
 
