@@ -28,20 +28,30 @@ Result<QByteArray> readAll(const PictureInput& input) {
     return bytes;
 }
 
-// The reader takes a BMP that breaks off for a whole one and leaves the rest black.
-bool isCutShortBmp(const QByteArray& bytes) {
+// What the reader of BMP files does not look at: absurd sizes, which it takes for damage, and a file that breaks off,
+// which it takes for a whole one and leaves the rest black.
+Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
     constexpr qsizetype headers = 14 + 40;
-    if (bytes.size() < headers)
-        return true;
     const auto* data = reinterpret_cast<const uchar*>(bytes.constData());
-    const auto compression = qFromLittleEndian<quint32>(data + 30);
-    if (compression == 1 || compression == 2) // run lengths: the size says nothing
-        return false;
+    const bool oldHeader = bytes.size() >= 18 && qFromLittleEndian<quint32>(data + 14) == 12;
+    if (oldHeader)
+        return {};
+    const auto cutShort = [&] {
+        return pictureFailure(input.path(), Failure::Kind::Damaged, QStringLiteral("the picture is cut short"));
+    };
+    if (bytes.size() < headers)
+        return cutShort();
     const qint64 offset = qFromLittleEndian<quint32>(data + 10);
     const qint64 width = qFromLittleEndian<qint32>(data + 18);
     const qint64 height = qAbs(static_cast<qint64>(qFromLittleEndian<qint32>(data + 22)));
     const qint64 bits = qFromLittleEndian<quint16>(data + 28);
-    return offset + (width * bits + 31) / 32 * 4 * height > bytes.size();
+    const auto compression = qFromLittleEndian<quint32>(data + 30);
+    if (auto bounds = checkPictureBounds(input.path(), width, height); !bounds)
+        return bounds;
+    const bool runLengths = compression == 1 || compression == 2; // there the size says nothing
+    if (!runLengths && offset + (width * bits + 31) / 32 * 4 * height > bytes.size())
+        return cutShort();
+    return {};
 }
 
 template <class Value, class Use>
@@ -54,6 +64,10 @@ Result<Value> withReader(const PictureInput& input, const Use& use) {
     if (!bytes)
         return bytes.failure();
     const bool bmp = input.format() == PictureInput::Format::Bmp;
+    if (bmp) {
+        if (auto checked = checkBmp(input, *bytes); !checked)
+            return checked.failure();
+    }
     QBuffer buffer(&*bytes);
     buffer.open(QIODevice::ReadOnly);
     QImageReader reader(&buffer, bmp ? "bmp" : "png");
@@ -64,8 +78,6 @@ Result<Value> withReader(const PictureInput& input, const Use& use) {
                               QStringLiteral("the picture is damaged or cut short"));
     if (auto bounds = checkPictureBounds(input.path(), size.width(), size.height()); !bounds)
         return bounds.failure();
-    if (bmp && isCutShortBmp(*bytes))
-        return pictureFailure(input.path(), Failure::Kind::Damaged, QStringLiteral("the picture is cut short"));
     return use(reader);
 }
 

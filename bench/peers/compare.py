@@ -1,0 +1,104 @@
+#!/usr/bin/env python3
+"""Scaling to paper and small pictures beside the peers, as whole processes over the same generated photographs.
+
+usage: compare.py BUILD_FOLDER [--rounds N] [--pictures N] [--install]
+
+Each peer is run in pairs with ours, in turn first and second, so that whatever else the machine does falls on both; the ratio of
+a pair is peer's time / ours, and the median of the pairs is printed. Times are processor time; for more than one thread they are
+elapsed time. --install fetches the peers from Debian first (root or sudo).
+"""
+import argparse, os, shutil, statistics, subprocess, sys, tempfile, time
+
+PACKAGES = ["libvips-tools", "imagemagick", "libopencv-imgproc-dev", "libopencv-imgcodecs-dev", "libzimg-dev"]
+
+
+def run(command, environment=None):
+    """Elapsed seconds and processor seconds."""
+    begin = time.monotonic()
+    process = subprocess.Popen(command, stdout=subprocess.DEVNULL, env={**os.environ, **(environment or {})})
+    _, status, usage = os.wait4(process.pid, 0)
+    process.returncode = os.waitstatus_to_exitcode(status)
+    if process.returncode != 0:
+        sys.exit(f"failed with {process.returncode}: {' '.join(command[:6])} ...")
+    return time.monotonic() - begin, usage.ru_utime + usage.ru_stime
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
+    parser.add_argument("build")
+    parser.add_argument("--rounds", type=int, default=9)
+    parser.add_argument("--pictures", type=int, default=12)
+    parser.add_argument("--install", action="store_true")
+    options = parser.parse_args()
+    if options.install:
+        subprocess.run(([] if os.geteuid() == 0 else ["sudo"]) + ["apt-get", "install", "-y", "-q"] + PACKAGES, check=True)
+        sys.exit("installed; build the preset bench again, then run without --install")
+
+    programs = os.path.join(options.build, "bench", "peers")
+    memory = "/dev/shm" if os.path.isdir("/dev/shm") else None
+    with tempfile.TemporaryDirectory(dir=memory) as folder:
+        source, out = os.path.join(folder, "source"), os.path.join(folder, "out")
+        os.mkdir(source)
+        os.mkdir(out)
+        subprocess.run([os.path.join(programs, "bench_photographs"), source, str(options.pictures)], check=True)
+        files = sorted(os.path.join(source, name) for name in os.listdir(source))
+        bits = sum(os.path.getsize(name) for name in files) * 8 / (12e6 * len(files))
+        print(f"{len(files)} photographs of 12 megapixels, {bits:.2f} bits a pixel; {options.rounds} interleaved pairs\n")
+
+        def ours(mode, variant="best"):
+            return [os.path.join(programs, "bench_ours"), mode, variant, out] + files
+
+        def own(name):
+            path = os.path.join(programs, name)
+            return [path, "1800", "1200", out] + files if os.path.exists(path) else None
+
+        vips = shutil.which("vipsthumbnail")
+        magick = next((path for path in map(shutil.which, ("convert-im6.q16", "magick")) if path), None)
+        # A square and a portrait picture take the short side as width, here by a box that the landscape pictures fill by theirs.
+        paper_box = "1800x1800"
+        vips_paper = [vips, "--size", paper_box, "--no-rotate", "-o", out + "/%s.jpg[Q=90,subsample-mode=on]"] + files if vips else None
+        vips_small = [vips, "--size", "115x115", "--no-rotate", "-o", out + "/%s.jpg[Q=75,subsample-mode=on]"] + files if vips else None
+        magick_paper = [magick] + files + ["-resize", "1800x1800", "-sampling-factor", "4:2:0", "-quality", "90",
+                                           out + "/%02d.jpg"] if magick else None
+        one, two = {"VIPS_CONCURRENCY": "1"}, {"VIPS_CONCURRENCY": "2"}
+        lines = [
+            ("paper: vipsthumbnail, 1 thread", vips_paper, one, ours("paper"), ">= 2.5"),
+            ("paper: Qt smooth scaling", own("peer_qt"), None, ours("paper"), ">= 1.6"),
+            ("paper: OpenCV AREA", own("peer_opencv"), None, ours("paper"), ">= 2.3"),
+            ("paper: ImageMagick, 1 thread", magick_paper, {"MAGICK_THREAD_LIMIT": "1"}, ours("paper"), ">= 7"),
+            ("paper: zimg on the same planes", own("peer_zimg"), None, ours("paper"), ">= 0.95"),
+            ("small pictures: vipsthumbnail, 1 thread", vips_small, one, ours("small", "1"), ""),
+            ("small pictures: vipsthumbnail / ours on 2 threads, elapsed", vips_small, one, ours("small", "2"), ">= 2.2"),
+        ]
+        print(f"{'peer / ours':62} {'goal':>8} {'median':>7} {'lowest':>7} {'highest':>7}")
+
+        def compare(label, peer, environment, mine, goal):
+            elapsed = "elapsed" in label
+            if not peer:
+                print(f"{label:62} {goal:>8}   not installed")
+                return
+            ratios = []
+            run(mine)
+            for turn in range(options.rounds):
+                if turn % 2:
+                    theirs, ourtime = run(peer, environment), run(mine)
+                else:
+                    ourtime, theirs = run(mine), run(peer, environment)
+                ratios.append(theirs[not elapsed] / ourtime[not elapsed])
+            print(f"{label:62} {goal:>8} {statistics.median(ratios):7.2f} {min(ratios):7.2f} {max(ratios):7.2f}", flush=True)
+
+        for line in lines:
+            compare(*line)
+        # The other way round: ours above, the floor below.
+        run(ours("planes", "-"))
+        floor = ours("floor", "-")
+        compare("paper: ours / floor", ours("paper"), None, floor, "<= 1.20")
+        compare("paper: ours with SSSE3 / floor", ours("paper", "SSSE3"), None, floor, "<= 1.30")
+        compare("paper: ours in plain C++ / floor", ours("paper", "plain"), None, floor, "")
+        kib = lambda command: int(subprocess.run(command, check=True, capture_output=True, text=True).stdout.split()[0])
+        idle = kib([os.path.join(programs, "bench_ours"), "idle", "-", "-"])
+        peak = kib(ours("paper"))
+        print(f"\npaper: peak memory {peak / 1024:.1f} MiB, {(peak - idle) / 1024:.1f} MiB over idle (goal 24)")
+
+
+main()

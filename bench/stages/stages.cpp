@@ -1,0 +1,122 @@
+// The stages of the picture path, one picture of 12 megapixels: what each costs, and each kind of vectors.
+
+#include "common/WholeFile.h"
+#include "imaging/JpegWriter.h"
+#include "imaging/Resample.h"
+#include "support/SamplePhotographs.h"
+
+#include <QTemporaryDir>
+
+#include <benchmark/benchmark.h>
+
+#include <cstdlib>
+
+using namespace lumora;
+
+namespace {
+
+constexpr PictureSize paper{1800, 1350};
+
+const std::filesystem::path& photograph() {
+    static const QTemporaryDir folder;
+    static const std::filesystem::path path = [] {
+        const auto paths = writeSamplePhotographs(folder.path().toStdString(), 1);
+        if (!paths)
+            std::abort();
+        return paths->front();
+    }();
+    return path;
+}
+
+std::unique_ptr<JpegReader> reader() {
+    return std::move(*JpegReader::open(std::move(*PictureInput::open(photograph()))));
+}
+
+class DroppedPlanes : public PlaneTaker {
+public:
+    void begin(const std::vector<PlaneLayout>& planes) override {
+        m_planes = planes;
+        for (const PlaneLayout& plane : planes)
+            m_rows.emplace_back(static_cast<std::size_t>(plane.rowsAtOnce) * static_cast<std::size_t>(plane.rowBytes));
+    }
+    unsigned char* row(int plane, int y) override {
+        const PlaneLayout& layout = m_planes[static_cast<std::size_t>(plane)];
+        return m_rows[static_cast<std::size_t>(plane)].data() + std::ptrdiff_t{y % layout.rowsAtOnce} * layout.rowBytes;
+    }
+    void rowsReady() override {}
+
+private:
+    std::vector<PlaneLayout> m_planes;
+    std::vector<std::vector<unsigned char>> m_rows;
+};
+
+void decodeToPlanes(benchmark::State& state) {
+    for (auto _ : state) {
+        DroppedPlanes planes;
+        if (!reader()->readPlanes(static_cast<int>(state.range(0)), planes))
+            state.SkipWithError("not read");
+    }
+}
+BENCHMARK(decodeToPlanes)->ArgName("denominator")->Arg(1)->Arg(2)->Arg(8)->Unit(benchmark::kMillisecond);
+
+void encodeFromPlanes(benchmark::State& state) {
+    // The planes of the real result, so that the encoder has real work.
+    const auto bytes = scalePictureToJpeg(photograph(), paper, 95);
+    const QTemporaryDir folder;
+    const std::filesystem::path path = folder.path().toStdString() + "/a.jpg";
+    if (!bytes || !writeWholeFile(path, *bytes))
+        return state.SkipWithError("not made");
+    for (auto _ : state) {
+        PictureTimes times;
+        if (!scalePictureToJpeg(path, paper, 90, &times))
+            state.SkipWithError("not written");
+        state.SetIterationTime(times.encode / 1000);
+    }
+}
+BENCHMARK(encodeFromPlanes)->UseManualTime()->Unit(benchmark::kMillisecond);
+
+void resizeBetween(benchmark::State& state) {
+    for (auto _ : state) {
+        PictureTimes times;
+        if (!scalePictureToJpeg(photograph(), paper, 90, &times))
+            state.SkipWithError("not written");
+        state.SetIterationTime(times.draw / 1000);
+    }
+}
+BENCHMARK(resizeBetween)->UseManualTime()->Unit(benchmark::kMillisecond);
+
+void toPaper(benchmark::State& state, const ResampleKernels& kernels) {
+    for (auto _ : state) {
+        if (!readResampledToJpeg(*reader(), paper, 90, kernels))
+            state.SkipWithError("not scaled");
+    }
+}
+
+void smallPicture(benchmark::State& state) {
+    for (auto _ : state) {
+        if (!loadPictureScaled(photograph(), {115, 86}))
+            state.SkipWithError("not scaled");
+    }
+}
+BENCHMARK(smallPicture)->Unit(benchmark::kMillisecond);
+
+void twelveSmallPictures(benchmark::State& state) {
+    const std::vector<std::filesystem::path> paths(12, photograph());
+    for (auto _ : state)
+        benchmark::DoNotOptimize(loadSmallPictures(paths, 115));
+}
+BENCHMARK(twelveSmallPictures)->UseRealTime()->Unit(benchmark::kMillisecond);
+
+} // namespace
+
+int main(int argc, char** argv) {
+    static const auto all = allKernels();
+    for (const NamedKernels& one : all)
+        benchmark::RegisterBenchmark(("toPaper/" + one.name).c_str(), toPaper, one.kernels)
+            ->Unit(benchmark::kMillisecond);
+    benchmark::Initialize(&argc, argv);
+    if (benchmark::ReportUnrecognizedArguments(argc, argv))
+        return 2;
+    benchmark::RunSpecifiedBenchmarks();
+    return 0;
+}
