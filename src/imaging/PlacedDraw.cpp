@@ -1,0 +1,272 @@
+#include "imaging/PlacedDraw.h"
+
+#include "common/FixedText.h"
+#include "imaging/PixelRows.h"
+#include "imaging/Resample.h"
+
+#include <QPainter>
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+#include <numbers>
+#include <utility>
+#include <vector>
+
+namespace lumora {
+namespace {
+
+struct Turn {
+    double cosine;
+    double sine;
+};
+
+// Quarter turns are exact, so that their edges stay hard and their pixels where they were.
+Turn turnOf(int rotationCode) {
+    const int degrees = ((rotationCode - 180) % 360 + 360) % 360;
+    switch (degrees) {
+    case 0:
+        return {1, 0};
+    case 90:
+        return {0, 1};
+    case 180:
+        return {-1, 0};
+    case 270:
+        return {0, -1};
+    default:
+        const double angle = degrees * std::numbers::pi / 180.0;
+        return {std::cos(angle), std::sin(angle)};
+    }
+}
+
+// The picture's own position of a point of the paper: u to the right and v down in zoomed pixels, (0, 0) the picture's
+// corner.
+struct Inverse {
+    Turn turn;
+    double originX;
+    double originY;
+
+    Inverse(const Placement& placement, PictureSize zoomed)
+        : turn(turnOf(placement.rotationCode))
+        , originX(zoomed.width / 2 - (turn.cosine * placement.panX + turn.sine * placement.panY))
+        , originY(zoomed.height / 2 - (-turn.sine * placement.panX + turn.cosine * placement.panY)) {}
+
+    double u(double x, double y) const { return turn.cosine * x + turn.sine * y + originX; }
+    double v(double x, double y) const { return -turn.sine * x + turn.cosine * y + originY; }
+};
+
+// The part of [from, to) in which low <= start + step * x <= high at pixel centres.
+std::pair<int, int> narrowed(std::pair<int, int> range, double start, double step, double low, double high) {
+    if (step == 0.0)
+        return start >= low && start < high ? range : std::pair(0, 0);
+    double first = (low - start) / step - 0.5;
+    double last = (high - start) / step - 0.5;
+    if (step < 0)
+        std::swap(first, last);
+    const auto held = [](double value) { return static_cast<int>(std::clamp(value, -1e6, 1e6)); };
+    return {std::max(range.first, held(std::ceil(first - 1e-9))), std::min(range.second, held(std::ceil(last - 1e-9)))};
+}
+
+// The toned part of the source that the paper can show, with its edges repeated.
+class PreparedSource {
+public:
+    static constexpr int margin = 6;
+
+    PreparedSource(const Bitmap& source, QRect wanted, const ColourMatrix& matrix)
+        : m_area(wanted)
+        , m_stride(wanted.width() + 2 * margin)
+        , m_pixels(static_cast<std::size_t>(m_stride) * static_cast<std::size_t>(wanted.height() + 2 * margin)) {
+        const bool toned = !matrix.changesNothing();
+        for (int y = 0; y < wanted.height(); ++y) {
+            const auto* from =
+                reinterpret_cast<const std::uint32_t*>(source.image().constScanLine(wanted.top() + y)) + wanted.left();
+            std::uint32_t* row = rowOf(y);
+            if (toned)
+                applyMatrixToRow(matrix, from, row, wanted.width());
+            else
+                std::memcpy(row, from, static_cast<std::size_t>(wanted.width()) * sizeof(std::uint32_t));
+            std::fill_n(row - margin, margin, row[0]);
+            std::fill_n(row + wanted.width(), margin, row[wanted.width() - 1]);
+        }
+        for (int y = 1; y <= margin; ++y) {
+            std::copy_n(rowOf(0) - margin, m_stride, rowOf(-y) - margin);
+            std::copy_n(rowOf(wanted.height() - 1) - margin, m_stride, rowOf(wanted.height() - 1 + y) - margin);
+        }
+    }
+
+    PaddedPicture padded() const { return {rowOf(0), m_stride}; }
+    int left() const { return m_area.left(); }
+    int top() const { return m_area.top(); }
+
+private:
+    std::uint32_t* rowOf(int y) { return m_pixels.data() + (std::ptrdiff_t(y) + margin) * m_stride + margin; }
+    const std::uint32_t* rowOf(int y) const {
+        return m_pixels.data() + (std::ptrdiff_t(y) + margin) * m_stride + margin;
+    }
+
+    QRect m_area;
+    std::ptrdiff_t m_stride;
+    std::vector<std::uint32_t> m_pixels;
+};
+
+std::uint32_t blended(std::uint32_t below, std::uint32_t above, double coverage) {
+    const auto weight = static_cast<std::uint32_t>(std::lround(coverage * 256.0));
+    std::uint32_t result = 0xFF000000U;
+    for (int shift = 0; shift < 24; shift += 8) {
+        const std::uint32_t under = (below >> shift) & 0xFF;
+        const std::uint32_t over = (above >> shift) & 0xFF;
+        result |= ((under * (256 - weight) + over * weight + 128) >> 8) << shift;
+    }
+    return result;
+}
+
+// Source rows and columns that samples for this paper can touch.
+QRect touched(const Inverse& inverse, PictureSize paper, double scaleX, double scaleY, PictureSize source) {
+    double left = 1e9;
+    double top = 1e9;
+    double right = -1e9;
+    double bottom = -1e9;
+    for (const double x : {0.0, double(paper.width)}) {
+        for (const double y : {0.0, double(paper.height)}) {
+            const double u = inverse.u(x, y) * scaleX;
+            const double v = inverse.v(x, y) * scaleY;
+            left = std::min(left, u);
+            right = std::max(right, u);
+            top = std::min(top, v);
+            bottom = std::max(bottom, v);
+        }
+    }
+    const auto held = [](double value, int limit) { return static_cast<int>(std::clamp(value, 0.0, double(limit))); };
+    const int reach = 4;
+    const int x0 = std::min(held(left - reach, source.width), source.width - 1);
+    const int y0 = std::min(held(top - reach, source.height), source.height - 1);
+    const int x1 = std::max(held(right + reach, source.width), x0 + 1);
+    const int y1 = std::max(held(bottom + reach, source.height), y0 + 1);
+    return {x0, y0, x1 - x0, y1 - y0};
+}
+
+} // namespace
+
+PictureSize Placement::zoomed() const {
+    const double zoom = zoomPercent / 100.0;
+    return {std::max(1, static_cast<int>(RoundHalfEven(drawWidth * zoom))),
+            std::max(1, static_cast<int>(RoundHalfEven(drawHeight * zoom)))};
+}
+
+Placement::Point Placement::onPaper(double x, double y) const {
+    const Turn turn = turnOf(rotationCode);
+    const PictureSize size = zoomed();
+    const double across = x - size.width / 2;
+    const double down = y - size.height / 2;
+    return {panX + turn.cosine * across - turn.sine * down, panY + turn.sine * across + turn.cosine * down};
+}
+
+bool Placement::covers(PictureSize paper) const {
+    const PictureSize size = zoomed();
+    const Inverse inverse(*this, size);
+    const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
+    const double edge = level ? 0.0 : 0.5;
+    for (const double x : {0.5, paper.width - 0.5}) {
+        for (const double y : {0.5, paper.height - 0.5}) {
+            const double u = inverse.u(x, y);
+            const double v = inverse.v(x, y);
+            if (u < edge || u > size.width - edge || v < edge || v > size.height - edge)
+                return false;
+        }
+    }
+    return true;
+}
+
+PictureSize reducedSize(PictureSize source, const Placement& placement) {
+    const PictureSize zoomed = placement.zoomed();
+    const auto enough = [](int side) { return static_cast<int>(std::ceil(side * 1.25)); };
+    return {std::min(source.width, enough(zoomed.width)), std::min(source.height, enough(zoomed.height))};
+}
+
+void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement, const ColourMatrix& matrix) {
+    if (paper.isNull() || source.isNull())
+        return;
+    const PictureSize reduced = reducedSize({source.width(), source.height()}, placement);
+    if (reduced != PictureSize{source.width(), source.height()}) {
+        drawPlaced(paper, resampled(source, reduced), placement, matrix);
+        return;
+    }
+    Bitmap plain = source;
+    if (plain.image().format() != QImage::Format_RGB32)
+        plain = Bitmap(plain.image().convertToFormat(QImage::Format_RGB32));
+
+    const PictureSize zoomed = placement.zoomed();
+    const PictureSize size{paper.width(), paper.height()};
+    const Inverse inverse(placement, zoomed);
+    const double scaleX = double(plain.width()) / zoomed.width;
+    const double scaleY = double(plain.height()) / zoomed.height;
+    const PreparedSource prepared(plain, touched(inverse, size, scaleX, scaleY, {plain.width(), plain.height()}),
+                                  matrix);
+    const PaddedPicture padded = prepared.padded();
+
+    const auto fixed = [](double value) { return static_cast<std::int64_t>(std::llround(value * 4294967296.0)); };
+    const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
+    const double stepU = inverse.turn.cosine;
+    const double stepV = -inverse.turn.sine;
+    const double outer = level ? 0.0 : 0.5; // how far coverage reaches past the edge
+    std::vector<std::uint32_t> samples(static_cast<std::size_t>(size.width));
+
+    for (int y = 0; y < size.height; ++y) {
+        const double startU = inverse.u(0, y + 0.5);
+        const double startV = inverse.v(0, y + 0.5);
+        const auto inside = [&](double edge) {
+            auto range = narrowed({0, size.width}, startU, stepU, -edge, zoomed.width + edge);
+            return narrowed(range, startV, stepV, -edge, zoomed.height + edge);
+        };
+        const auto [from, to] = inside(outer);
+        if (from >= to)
+            continue;
+        auto [solidFrom, solidTo] = inside(-outer);
+        if (solidFrom >= solidTo)
+            solidFrom = solidTo = to;
+
+        const double u = startU + stepU * (from + 0.5);
+        const double v = startV + stepV * (from + 0.5);
+        // Half a phase of the sampler's weights, which cut the position.
+        const double half = 1.0 / 512.0;
+        const SampleLine line{fixed(u * scaleX - 0.5 - prepared.left() + half),
+                              fixed(v * scaleY - 0.5 - prepared.top() + half), fixed(stepU * scaleX),
+                              fixed(stepV * scaleY)};
+        auto* row = reinterpret_cast<std::uint32_t*>(paper.image().scanLine(y));
+        if (solidFrom == from && solidTo == to) {
+            sampleLine(padded, line, row + from, to - from);
+            continue;
+        }
+        sampleLine(padded, line, samples.data(), to - from);
+        for (int x = from; x < to; ++x) {
+            const std::uint32_t sample = samples[static_cast<std::size_t>(x - from)];
+            if (x >= solidFrom && x < solidTo) {
+                row[x] = sample;
+                continue;
+            }
+            const double atU = startU + stepU * (x + 0.5);
+            const double atV = startV + stepV * (x + 0.5);
+            const double coverage = std::clamp(std::min(atU, zoomed.width - atU) + 0.5, 0.0, 1.0) *
+                                    std::clamp(std::min(atV, zoomed.height - atV) + 0.5, 0.0, 1.0);
+            row[x] = blended(row[x], sample, coverage);
+        }
+    }
+}
+
+void drawKeyedFrame(Bitmap& paper, const Bitmap& frame) {
+    if (paper.isNull() || frame.isNull())
+        return;
+    QImage keyed = frame.image().convertToFormat(QImage::Format_ARGB32);
+    for (int y = 0; y < keyed.height(); ++y) {
+        auto* row = reinterpret_cast<QRgb*>(keyed.scanLine(y));
+        for (int x = 0; x < keyed.width(); ++x) {
+            const int sum = qRed(row[x]) + qGreen(row[x]) + qBlue(row[x]);
+            row[x] = (row[x] & 0x00FFFFFFU) | (static_cast<QRgb>(std::min(255, 11 * sum)) << 24);
+        }
+    }
+    const Bitmap stretched = resampled(Bitmap(keyed), {paper.width(), paper.height()});
+    QPainter painter(&paper.image());
+    painter.drawImage(0, 0, stretched.image());
+}
+
+} // namespace lumora

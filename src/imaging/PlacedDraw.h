@@ -1,0 +1,53 @@
+#pragma once
+
+#include "imaging/Bitmap.h"
+#include "imaging/ColourMatrix.h"
+#include "imaging/PictureFile.h"
+
+namespace lumora {
+
+// Where a picture lands on the paper: zoomed and turned about the pan point, never mirrored. All in pixels of the
+// paper.
+//
+//     W = round_half_even(drawWidth * zoomPercent / 100), H likewise
+//     screen = (panX, panY) + R(rotationCode - 180) * (u * W / sourceWidth - floor(W / 2), v * H / sourceHeight -
+//     floor(H / 2)) R(a) = [cos a, -sin a; sin a, cos a], y down: a positive angle turns clockwise
+//
+// so that a rotation code of 180 is upright.
+struct Placement {
+    double drawWidth = 0; // before the zoom
+    double drawHeight = 0;
+    int zoomPercent = 100;
+    int rotationCode = 180;
+    double panX = 0;
+    double panY = 0;
+
+    // The zoomed size; at least 1 pixel a side.
+    PictureSize zoomed() const;
+
+    // Where the point (x, y) of the zoomed, unturned picture lands.
+    struct Point {
+        double x;
+        double y;
+    };
+    Point onPaper(double x, double y) const;
+
+    // True when no pixel of a paper of this size is left uncovered.
+    bool covers(PictureSize paper) const;
+};
+
+// The size to which a larger source is best reduced before it is drawn at the zoomed size: a quarter more, so that the
+// sampling takes nothing from its sharpness. Never more than the source has.
+PictureSize reducedSize(PictureSize source, const Placement& placement);
+
+// Draws source over what paper shows. The colour matrix acts before the sampling, which is a 4x4 cubic (a = -0.5) at
+// pixel centres with the edge pixels repeated outside; a flat picture stays flat to the last bit. A pixel is painted if
+// its centre lies inside the picture, with smooth coverage along edges that are neither level nor upright. A source
+// larger than reducedSize() is reduced first.
+void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement, const ColourMatrix& matrix);
+
+// Lays a frame over the whole paper: alpha = min(255, 11 * (red + green + blue)), so that black is transparent; the
+// alpha is taken before the stretching, and colours are weighted by it.
+void drawKeyedFrame(Bitmap& paper, const Bitmap& frame);
+
+} // namespace lumora

@@ -1,0 +1,166 @@
+#include "imaging/PlacedDraw.h"
+
+#include <gtest/gtest.h>
+
+#include <array>
+#include <cmath>
+
+namespace lumora {
+namespace {
+
+Placement placed(double width, double height, int zoom, int rotation, double panX, double panY) {
+    Placement placement;
+    placement.drawWidth = width;
+    placement.drawHeight = height;
+    placement.zoomPercent = zoom;
+    placement.rotationCode = rotation;
+    placement.panX = panX;
+    placement.panY = panY;
+    return placement;
+}
+
+// Four flat quarters: red, green above blue, white.
+Bitmap quarters(int width, int height) {
+    Bitmap picture(width, height, Qt::red);
+    for (int y = 0; y < height; ++y) {
+        for (int x = 0; x < width; ++x) {
+            const bool right = x >= width / 2;
+            const bool below = y >= height / 2;
+            picture.image().setPixel(x, y,
+                                     below ? (right ? 0xFFFFFFFF : 0xFF0000FF) : (right ? 0xFF00FF00 : 0xFFFF0000));
+        }
+    }
+    return picture;
+}
+
+TEST(Placement, PutsTheCornersWhereTheLabsPrintsHaveThem) {
+    struct Case {
+        Placement placement;
+        int width, height;
+        double x0, y0, x1, y1;
+    };
+    const Case cases[] = {
+        {placed(450, 337, 100, 180, 225, 150), 450, 337, 0, -18, 450, 319},
+        {placed(450, 337, 40, 180, 225, 150), 180, 135, 135, 83, 315, 218},
+        {placed(450, 337, 150, 180, 225, 150), 675, 506, -112, -103, 563, 403}, // 505.5 is a tie, to even
+        {placed(450, 337, 210, 180, 225, 150), 945, 708, -247, -204, 698, 504},
+        {placed(311, 415, 100, 180, 150, 207), 311, 415, -5, 0, 306, 415},
+        {placed(450, 337, 150, 195, 245, 140), 675, 506, -15.04, -191.60, 506.00, 471.86},
+        {placed(311, 415, 80, 270, 130, 217), 249, 332, 296, 93, -36, 342},
+        {placed(1500, 1125, 150, 195, 816.6667, 466.6667), 2250, 1688, -51.56, -639.75, 1684.89, 1573.08},
+    };
+    for (const Case& expected : cases) {
+        const PictureSize size = expected.placement.zoomed();
+        EXPECT_EQ(size, (PictureSize{expected.width, expected.height}));
+        const auto first = expected.placement.onPaper(0, 0);
+        const auto last = expected.placement.onPaper(size.width, size.height);
+        EXPECT_NEAR(first.x, expected.x0, 0.01);
+        EXPECT_NEAR(first.y, expected.y0, 0.01);
+        EXPECT_NEAR(last.x, expected.x1, 0.01);
+        EXPECT_NEAR(last.y, expected.y1, 0.01);
+    }
+}
+
+TEST(PlacedDraw, LeavesAnUprightPictureOfItsOwnSizeAsItIs) {
+    const Bitmap picture = quarters(40, 30);
+    Bitmap paper(40, 30, Qt::black);
+    drawPlaced(paper, picture, placed(40, 30, 100, 180, 20, 15), ColourMatrix());
+    EXPECT_EQ(paper.image(), picture.image());
+}
+
+TEST(PlacedDraw, TurnsClockwiseWithoutMirroring) {
+    struct Case {
+        int rotationCode;
+        std::array<QRgb, 4> corners; // top left, top right, bottom left, bottom right
+    };
+    const QRgb red = 0xFFFF0000;
+    const QRgb green = 0xFF00FF00;
+    const QRgb blue = 0xFF0000FF;
+    const QRgb white = 0xFFFFFFFF;
+    const Case cases[] = {{180, {red, green, blue, white}}, {270, {blue, red, white, green}},
+                          {360, {white, blue, green, red}}, {90, {green, white, red, blue}},
+                          {-90, {blue, red, white, green}}, {540, {red, green, blue, white}}};
+    const Bitmap picture = quarters(40, 40);
+    for (const Case& expected : cases) {
+        Bitmap paper(40, 40, Qt::black);
+        drawPlaced(paper, picture, placed(40, 40, 100, expected.rotationCode, 20, 20), ColourMatrix());
+        const std::array<QRgb, 4> found = {paper.image().pixel(2, 2), paper.image().pixel(37, 2),
+                                           paper.image().pixel(2, 37), paper.image().pixel(37, 37)};
+        EXPECT_EQ(found, expected.corners) << expected.rotationCode;
+    }
+}
+
+TEST(PlacedDraw, KeepsAFlatPictureFlatAndCoversThePaper) {
+    const QRgb colour = qRgb(37, 141, 211);
+    for (const int rotationCode : {180, 183, 217, 270, 301}) {
+        for (const int zoom : {40, 100, 137, 210}) {
+            Bitmap paper(90, 60, Qt::black);
+            const Placement placement = placed(90, 68, zoom, rotationCode, 45, 30);
+            drawPlaced(paper, Bitmap(400, 300, QColor(colour)), placement, ColourMatrix());
+            EXPECT_EQ(paper.image().pixel(45, 30), colour);
+            if (!placement.covers({90, 60}))
+                continue;
+            for (int y = 0; y < 60; ++y)
+                for (int x = 0; x < 90; ++x)
+                    ASSERT_EQ(paper.image().pixel(x, y), colour) << x << ',' << y << ' ' << rotationCode << ' ' << zoom;
+        }
+    }
+}
+
+TEST(PlacedDraw, LeavesThePaperAloneWhereThePictureDoesNotReach) {
+    Bitmap paper(90, 60, Qt::black);
+    drawPlaced(paper, quarters(40, 30), placed(90, 68, 210, 200, 999, 999), ColourMatrix());
+    EXPECT_EQ(paper.image(), Bitmap(90, 60, Qt::black).image());
+}
+
+TEST(ColourMatrix, FloorsAndClampsAsTheLabsPrintsDo) {
+    struct Case {
+        ColourMatrix matrix;
+        QRgb in;
+        QRgb out;
+    };
+    const auto gains = [](float r, float g, float b) { return ColourMatrix::fromGains(r, g, b, 0.001F); };
+    const ColourMatrix grey = ColourMatrix::grey(0.3F);
+    const Case cases[] = {
+        {gains(1, 1, 1), qRgb(255, 255, 255), qRgb(255, 255, 255)},
+        {gains(1, 1, 1), qRgb(200, 100, 50), qRgb(200, 100, 50)},
+        {grey, qRgb(255, 255, 255), qRgb(229, 229, 229)},
+        {grey, qRgb(255, 0, 0), qRgb(76, 76, 76)},
+        {grey, qRgb(100, 150, 200), qRgb(135, 135, 135)},
+        {grey, qRgb(1, 1, 1), qRgb(0, 0, 0)},
+        {gains(1.3F, 1, 0.8F), qRgb(135, 135, 135), qRgb(175, 135, 108)},
+        {gains(1.04F, 1.04F, 1.04F), qRgb(100, 150, 200), qRgb(104, 156, 208)},
+        {gains(1.6F, 1, 0.4F), qRgb(100, 150, 200), qRgb(160, 150, 80)},
+        {gains(2.5F, 2.5F, 2.5F), qRgb(200, 100, 50), qRgb(255, 250, 125)},
+        {gains(-0.5F, 1, -0.04F), qRgb(100, 150, 200), qRgb(0, 150, 0)},
+    };
+    for (const Case& expected : cases) {
+        // Wide enough for the vector loop, with a rest behind it.
+        const Bitmap result = expected.matrix.applied(Bitmap(37, 1, QColor(expected.in)));
+        EXPECT_EQ(result.image().pixel(0, 0), expected.out);
+        EXPECT_EQ(result.image().pixel(36, 0), expected.out);
+    }
+}
+
+TEST(KeyedFrame, MakesBlackTransparentAndDarkPartlySo) {
+    struct Case {
+        QRgb frame;
+        std::array<int, 3> out;
+    };
+    const Case cases[] = {{qRgb(0, 0, 0), {200, 150, 100}},
+                          {qRgb(1, 0, 0), {191, 143, 95}},
+                          {qRgb(10, 0, 0), {118, 85, 56}},
+                          {qRgb(24, 0, 0), {24, 0, 0}},
+                          {qRgb(255, 255, 255), {255, 255, 255}}};
+    for (const Case& expected : cases) {
+        Bitmap paper(8, 8, QColor(200, 150, 100));
+        drawKeyedFrame(paper, Bitmap(4, 4, QColor(expected.frame)));
+        const QRgb found = paper.image().pixel(4, 4);
+        EXPECT_NEAR(qRed(found), expected.out[0], 1);
+        EXPECT_NEAR(qGreen(found), expected.out[1], 1);
+        EXPECT_NEAR(qBlue(found), expected.out[2], 1);
+    }
+}
+
+} // namespace
+} // namespace lumora
