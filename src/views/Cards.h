@@ -42,8 +42,6 @@ protected:
     void paintInside(QPainter& painter, const QRectF& room) override;
 
 private:
-    void paintUpright(QPainter& painter, const QRectF& room);
-
     QString m_icon;
     QString m_explanation;
     bool m_marked = false;
