@@ -28,7 +28,7 @@ int PrintFileName::copies() const {
 }
 
 QString PrintBaseName(const QString& path) {
-    return RightPart(BaseNameOf(path), 20);
+    return RightPart(NameWithoutEnding(path), 20);
 }
 
 } // namespace lumora

@@ -31,7 +31,7 @@ QString MangleFileName(const QString& path)
     return name.replace(u'\\', u']').replace(u':', u';');
 }
 
-QString BaseNameOf(const QString& path)
+QString NameWithoutEnding(const QString& path)
 {
     return LeafName(path).chopped(std::min<qsizetype>(4, LeafName(path).size()));
 }

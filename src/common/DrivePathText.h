@@ -22,7 +22,7 @@ QString FolderOfPath(const QString& path);
 QString MangleFileName(const QString& path);
 
 // The base name of a print file: the leaf name less its last four characters.
-QString BaseNameOf(const QString& path);
+QString NameWithoutEnding(const QString& path);
 
 // folder and name with exactly one backslash between them.
 QString JoinDrivePath(const QString& folder, const QString& name);
