@@ -54,11 +54,10 @@ def main():
 
         vips = shutil.which("vipsthumbnail")
         magick = next((path for path in map(shutil.which, ("convert-im6.q16", "magick")) if path), None)
-        # A square and a portrait picture take the short side as width, here by a box that the landscape pictures fill by theirs.
-        paper_box = "1800x1800"
+        paper_box = "1800x1350"
         vips_paper = [vips, "--size", paper_box, "--no-rotate", "-o", out + "/%s.jpg[Q=90,subsample-mode=on]"] + files if vips else None
         vips_small = [vips, "--size", "115x115", "--no-rotate", "-o", out + "/%s.jpg[Q=75,subsample-mode=on]"] + files if vips else None
-        magick_paper = [magick] + files + ["-resize", "1800x1800", "-sampling-factor", "4:2:0", "-quality", "90",
+        magick_paper = [magick] + files + ["-resize", paper_box, "-sampling-factor", "4:2:0", "-quality", "90",
                                            out + "/%02d.jpg"] if magick else None
         one, two = {"VIPS_CONCURRENCY": "1"}, {"VIPS_CONCURRENCY": "2"}
         lines = [

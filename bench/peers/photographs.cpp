@@ -1,14 +1,20 @@
+#include "common/WholeFile.h"
 #include "support/SamplePhotographs.h"
 
 #include <cstdio>
 #include <cstdlib>
 
-// photographs FOLDER COUNT
+// photographs FOLDER COUNT: all of them landscape, so that one box means the same print to every peer.
 int main(int argc, char** argv) {
     if (argc != 3)
         return 2;
-    const auto paths = lumora::writeSamplePhotographs(argv[1], std::atoi(argv[2]));
-    if (!paths)
-        std::fprintf(stderr, "%s\n", qPrintable(paths.failure().message));
-    return paths ? 0 : 1;
+    for (int i = 1; i <= std::atoi(argv[2]); ++i) {
+        const std::filesystem::path path = std::filesystem::path(argv[1]) / ("IMG_" + std::to_string(100 + i) + ".jpg");
+        const auto bytes = lumora::samplePhotographFile({4000, 3000}, static_cast<unsigned>(i));
+        if (const auto written = lumora::writeWholeFile(path, bytes); !written) {
+            std::fprintf(stderr, "%s\n", qPrintable(written.failure().message));
+            return 1;
+        }
+    }
+    return 0;
 }
