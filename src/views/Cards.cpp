@@ -85,6 +85,10 @@ void Tile::setMarked(bool marked)
 
 void Tile::paintInside(QPainter& painter, const QRectF& room)
 {
+    if (room.height() > theme().px(170)) {
+        paintUpright(painter, room);
+        return;
+    }
     const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
     const double disc = std::min<double>(theme().px(60), room.height() * 0.7);
     const double gap = theme().px(16);
@@ -120,6 +124,35 @@ void Tile::paintInside(QPainter& painter, const QRectF& room)
     painter.drawText(QRectF(words.left(), y, words.width(), words.bottom() - y + theme().px(8)), flags, m_explanation);
 }
 
+void Tile::paintUpright(QPainter& painter, const QRectF& room)
+{
+    const double disc = theme().px(84);
+    const int flags = Qt::TextWordWrap | Qt::AlignHCenter | Qt::AlignTop;
+    painter.setLayoutDirection(layoutDirection());
+    const QFont head = theme().font(Theme::Type::Large);
+    const QFont body = theme().font(Theme::Type::Body);
+    const QRectF words = room.adjusted(theme().px(4), 0, -theme().px(4), 0);
+    const double headHeight = QFontMetricsF(head).boundingRect(words, flags, text()).height();
+    const double bodyHeight = m_explanation.isEmpty() ? 0 : QFontMetricsF(body).boundingRect(words, flags, m_explanation).height();
+    double y = room.center().y() - (disc + theme().px(18) + headHeight + theme().px(6) + bodyHeight) / 2;
+    const QRectF mark(room.center().x() - disc / 2, y, disc, disc);
+    painter.save();
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(m_marked ? Theme::Colour::Primary : Theme::Colour::PrimarySoft);
+    painter.drawEllipse(mark);
+    const int size = static_cast<int>(disc * 0.54);
+    painter.drawPixmap(mark.center() - QPointF(size / 2.0, size / 2.0),
+                       theme().icon(m_icon, size, m_marked ? QColor(Qt::white) : Theme::Colour::PrimaryDark));
+    painter.restore();
+    y += disc + theme().px(18);
+    painter.setFont(head);
+    painter.drawText(QRectF(words.left(), y, words.width(), headHeight + 2), flags, text());
+    y += headHeight + theme().px(6);
+    painter.setFont(body);
+    painter.setPen(Theme::Colour::Muted);
+    painter.drawText(QRectF(words.left(), y, words.width(), bodyHeight + 2), flags, m_explanation);
+}
+
 void drawSamplePicture(QPainter& painter, const QRectF& box)
 {
     painter.save();
@@ -148,7 +181,9 @@ void drawSamplePicture(QPainter& painter, const QRectF& box)
 
 void PaperCard::paintInside(QPainter& painter, const QRectF& room)
 {
-    const QStringList sides = text().split(u'/');
+    QString size = text();
+    size.remove(QChar(0x2066)).remove(QChar(0x2069)); // set apart for a Hebrew sentence
+    const QStringList sides = size.split(u'/');
     double first = sides.value(0).toDouble();
     double second = sides.value(1).toDouble();
     if (first <= 0 || second <= 0)
@@ -157,7 +192,7 @@ void PaperCard::paintInside(QPainter& painter, const QRectF& room)
     const QRectF place = room.adjusted(0, 0, 0, -textHeight);
     // All papers at one scale, so that a larger one looks larger; the largest that the lab cuts is 50 by 70.
     const double longer = std::max(first, second);
-    const double share = std::clamp(0.52 + 0.48 * (longer - 10) / 35.0, 0.52, 1.0);
+    const double share = std::clamp(0.62 + 0.38 * (longer - 10) / 30.0, 0.62, 1.0);
     const QSizeF paper = QSizeF(std::max(first, second), std::min(first, second)).scaled(place.size() * share, Qt::KeepAspectRatio);
     QRectF box(QPointF(), paper);
     box.moveCenter(place.center());

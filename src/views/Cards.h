@@ -42,6 +42,8 @@ protected:
     void paintInside(QPainter& painter, const QRectF& room) override;
 
 private:
+    void paintUpright(QPainter& painter, const QRectF& room);
+
     QString m_icon;
     QString m_explanation;
     bool m_marked = false;

@@ -119,7 +119,7 @@ void PageView::detach()
 {
     m_detached = true;
     m_soon.stop();
-    disconnect(&m_page, nullptr, this, nullptr);
+    disconnect(&m_page, &Page::changed, this, nullptr);
 }
 
 const PageView::Control* PageView::control(const QString& name) const
@@ -149,12 +149,16 @@ void PageView::renderBindings()
             check->setChecked(static_cast<const CheckCaption&>(caption).checked);
         }
         if (auto* edit = qobject_cast<QLineEdit*>(widget)) {
+            const bool leftwards = edit->layoutDirection() == Qt::RightToLeft;
+            edit->setAlignment(Qt::AlignAbsolute | Qt::AlignVCenter | (leftwards ? Qt::AlignRight : Qt::AlignLeft));
             if (edit->text() != caption.text) {
                 const QSignalBlocker quiet(edit);
                 edit->setText(caption.text);
             }
         } else if (auto* button = qobject_cast<QAbstractButton*>(widget)) {
-            const QString text = shownOnButton(caption.text);
+            QString text = shownOnButton(caption.text);
+            if (!button->icon().isNull()) // some air between the sign and the word
+                text = QChar(0xA0) + text + QChar(0xA0);
             if (button->text() != text)
                 button->setText(text);
             if (!button->property("spoken").toBool())

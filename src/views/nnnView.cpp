@@ -281,7 +281,12 @@ void nnnView::makeBars()
     m_choiceStatus = label(u"Choice"_s, m_page.Choice, "strong");
     m_choiceStatus->setWordWrap(false);
     frame().addStatus(m_choiceStatus);
-    frame().addStatus(label(u"Label4Tel"_s, m_page.Label4Tel, "muted"));
+    auto* phone = new QLabel(this);
+    phone->setPixmap(theme().icon(u"phone"_s, theme().px(22), Theme::Colour::Primary));
+    frame().addStatus(phone);
+    auto* telephone = label(u"Label4Tel"_s, m_page.Label4Tel, "muted");
+    telephone->setWordWrap(false);
+    frame().addStatus(telephone);
 
     m_toOptions = button(u"Command12"_s, m_page.Command12, Role::Main, [this] { m_page.Command12_Click(); });
     m_toBorders = button(u"Command8"_s, m_page.Command8, Role::Main, [this] { m_page.Command8_Click(); });
@@ -343,7 +348,6 @@ void nnnView::render()
     speak(m_telephone, m_page.LabelText3.text);
     speak(m_address, m_page.LabelText4.text);
     speak(m_moreSizes, wording(u"גדלים נוספים"_s, u"More sizes"_s));
-    m_telephone->setAlignment(state().english() ? Qt::AlignLeft : Qt::AlignRight);
     if (m_address->property("wanted").toBool() != m_page.Text4Calls) {
         m_address->setProperty("wanted", m_page.Text4Calls);
         m_address->setStyleSheet(m_address->styleSheet()); // the look follows the property only when it is set anew
