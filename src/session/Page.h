@@ -7,15 +7,15 @@ namespace lumora {
 
 // The pages by their design names.
 enum class PageId {
-    hatchala,   // the start page
-    nnn,        // kind of order, details, options
-    Havharot,   // clarifications and warnings
-    kyoskNew,   // choosing the pictures
-    tFrmNew,    // the editor
-    BigPics,    // the editor's work picture
-    RedI,       // red-eye
-    mikledet,   // on-screen keyboard
-    gdisave,    // saves pictures, never seen
+    hatchala, // the start page
+    nnn,      // kind of order, details, options
+    Havharot, // clarifications and warnings
+    kyoskNew, // choosing the pictures
+    tFrmNew,  // the editor
+    BigPics,  // the editor's work picture
+    RedI,     // red-eye
+    mikledet, // on-screen keyboard
+    gdisave,  // saves pictures, never seen
     Form3,
     B3,         // preparing an edited order
     Form2,      // preparing a plain order
@@ -28,15 +28,13 @@ enum class PageId {
 
 QString pageName(PageId id);
 
-// Everything that one page decides and shows. A view renders it; pages are made by the page chain, load() runs when a page is made,
-// and a page that hands over is deleted once its handlers have returned.
+// Everything that one page decides and shows. A view renders it; pages are made by the page chain, load() runs when a
+// page is made, and a page that hands over is deleted once its handlers have returned.
 class Page : public QObject {
     Q_OBJECT
 public:
     explicit Page(PageId id)
-        : m_id(id)
-    {
-    }
+        : m_id(id) {}
 
     PageId id() const { return m_id; }
     virtual void load() {}

@@ -18,23 +18,21 @@ public:
     using Maker = std::function<std::unique_ptr<Page>()>;
 
     explicit PageChain(const EventPump& pump)
-        : m_pump(pump)
-    {
-    }
+        : m_pump(pump) {}
     ~PageChain() override;
 
     void registerPage(PageId id, Maker maker);
 
-    // The page with this id, made and loaded if it does not exist yet, without bringing it to the front. A service page such as
-    // gdisave is used this way.
+    // The page with this id, made and loaded if it does not exist yet, without bringing it to the front. A service page
+    // such as gdisave is used this way.
     Page& load(PageId id);
 
     // Loads the page if need be and brings it to the front. False when no page of that id was registered.
     bool show(PageId id);
 
-    // Takes the page out of the chain at once and deletes it when all handlers have returned, also those that wait in a pump for the
-    // click that unloads their page. A chain is never without a page in front: when the last one that was shown goes, the start
-    // page comes.
+    // Takes the page out of the chain at once and deletes it when all handlers have returned, also those that wait in a
+    // pump for the click that unloads their page. A chain is never without a page in front: when the last one that was
+    // shown goes, the start page comes.
     void unload(PageId id);
 
     Page* find(PageId id) const;
@@ -57,7 +55,7 @@ private:
     const EventPump& m_pump;
     std::map<PageId, Maker> m_makers;
     std::map<PageId, std::unique_ptr<Page>> m_pages;
-    std::vector<Page*> m_shown; // the last one is in front
+    std::vector<Page*> m_shown;                // the last one is in front
     std::vector<std::unique_ptr<Page>> m_left; // unloaded, with handlers that may still be running
     bool m_ended = false;
 };

@@ -31,7 +31,7 @@ FtpFrm::FtpFrm(SessionState& state, const Platform& platform, PageChain& chain)
     // The page acts once it is in front, so that what it does is seen; made alone it sends nothing.
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
         if (page == this)
-            QTimer::singleShot(0, this, &FtpFrm::Form_Activate);
+            QTimer::singleShot(0, this, &FtpFrm::activateWhenFree);
     });
 }
 
@@ -53,6 +53,14 @@ void FtpFrm::load() {
     Picture1.visible = false;
     m_room->session.FtpEnableControls(false);
     Timer2.start();
+}
+
+// Inside the pump of a page that still hands over, clicks would not get through to this one.
+void FtpFrm::activateWhenFree() {
+    if (m_platform.pump.pumping())
+        QTimer::singleShot(20, this, &FtpFrm::activateWhenFree);
+    else
+        Form_Activate();
 }
 
 void FtpFrm::Form_Activate() {
@@ -210,6 +218,8 @@ void FtpFrm::Timer1_Tick() {
         Timer1.stop();
         return;
     }
+    if (m_platform.pump.pumping())
+        return;
     const int left = static_cast<int>(Val(Label33.text));
     Label33.text = Label20.text = QString::number(left - 1);
     Q_EMIT changed();

@@ -92,6 +92,7 @@ private:
     enum class Phase { NoOrder, Countdown, Waiting, Sending, Checking, Success, NotAll, Stopped, Silent };
 
     // FtpFrm.cpp
+    void activateWhenFree();
     void setButtonTexts();
     void setPanelTexts();
     void showWhatToDo();

@@ -51,8 +51,7 @@ void FtpFrm::Command4_Click() {
         return;
     UploadRoom& room = *m_room;
     Phase end = Phase::Silent;
-    room.session.ConnectFails = 0;
-    room.session.noSessionTold = false;
+    room.session.beginPass();
     room.pass.UserStopped = 0;
     for (int round = 1; round <= bulkRounds; ++round) {
         enter(Phase::Sending);

@@ -36,6 +36,13 @@ FtpSession::FtpSession(FtpDesk& desk)
     : m_desk(desk)
     , m_board(desk.board) {}
 
+void FtpSession::beginPass() {
+    ConnectFails = 0;
+    RoundNo = 0;
+    m_noLineTold = false;
+    m_noSessionTold = false;
+}
+
 void FtpSession::takeSettings() {
     FtpHost = m_desk.state.profile.FtpServer;
     FtpPass = m_desk.state.profile.FtpPassword;
@@ -79,9 +86,10 @@ void FtpSession::FtpOpenInternet() {
         FtpCloseAll();
     }
     tell(LineStep::Open, noLine());
-    m_desk.platform.dialogs.message(m_desk.wording(QStringLiteral("לא נוצר קשר אינטרנט לאחר מספר נסיונות"),
-                                                   QStringLiteral("No internet contact after several attempts: ")) +
-                                    QString::number(i));
+    if (!std::exchange(m_noLineTold, true))
+        m_desk.platform.dialogs.message(m_desk.wording(QStringLiteral("לא נוצר קשר אינטרנט לאחר מספר נסיונות"),
+                                                       QStringLiteral("No internet contact after several attempts: ")) +
+                                        QString::number(i));
     FtpEnableControls(true);
 }
 
@@ -146,7 +154,7 @@ void FtpSession::openFolder(const QString& name, Target target, Caption& asTold,
     RoundNo = 0;
     m_board.Frame9.visible = false;
     if (!bActiveSession) {
-        if (!std::exchange(noSessionTold, true))
+        if (!std::exchange(m_noSessionTold, true))
             m_desk.platform.dialogs.message(QStringLiteral("No in session!"));
         return;
     }

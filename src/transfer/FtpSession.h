@@ -20,6 +20,9 @@ class FtpSession {
 public:
     explicit FtpSession(FtpDesk& desk);
 
+    // A pass begins: its counters, and each box of a failed line may come once more.
+    void beginPass();
+
     // Host, user and password from the client profile.
     void takeSettings();
 
@@ -85,7 +88,6 @@ public:
     bool FolderOk = false;
     std::int16_t ConnectFails = 0;
     std::int16_t RoundNo = 0;
-    bool noSessionTold = false; // the box "No in session!" comes at most once a pass
     QString FtpHost, FtpUser, FtpPass;
     QString MikumBaSharat; // remote current directory without its leading slash
     QString LastResponse;  // the server's own words at the last refusal
@@ -102,6 +104,9 @@ private:
     FtpDesk& m_desk;
     FtpBoard& m_board;
     bool m_inOrderFolder = false;
+    // A pass asks for a session for each file; its boxes come once.
+    bool m_noLineTold = false;
+    bool m_noSessionTold = false;
 };
 
 // True when the profile names a host, a user and a password.

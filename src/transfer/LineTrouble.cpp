@@ -14,9 +14,10 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
                              QStringLiteral("This computer has no internet connection. Check it and try again."));
     case LineStep::Connect:
         if (answered)
-            return state.wording(
-                QStringLiteral("השרת לא קיבל את שם המשתמש או את הסיסמה. יש להודיע על כך לחנות."),
-                QStringLiteral("The server did not accept the user name or the password. Please tell the shop."));
+            return state.wording(QStringLiteral("השרת סירב לכניסה: ייתכן ששם המשתמש או הסיסמה שגויים, או שהשרת עמוס. "
+                                                "אפשר לנסות שוב או להודיע לחנות."),
+                                 QStringLiteral("The server refused the login: the user name or the password may be "
+                                                "wrong, or the server is busy. Try again, or tell the shop."));
         return state.wording(QStringLiteral("השרת אינו עונה. יש לבדוק את החיבור לאינטרנט ולנסות שוב בעוד כמה דקות."),
                              QStringLiteral("The server does not answer. Check the internet connection and try again "
                                             "in a few minutes."));

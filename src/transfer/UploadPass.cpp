@@ -17,9 +17,7 @@ void UploadPass::run() {
     m_board.Picture6.visible = false;
     m_board.Frame9.visible = false;
     m_board.Image6.visible = false;
-    m_session.ConnectFails = 0;
-    m_session.RoundNo = 0;
-    m_session.noSessionTold = false;
+    m_session.beginPass();
     StopFlag = false;
     for (int i = 0; i < m_board.List3.count() && !StopFlag && !m_desk.left; ++i) {
         m_board.List3.setCurrentIndex(i);

@@ -1,0 +1,63 @@
+#pragma once
+
+#include "platform/Internet.h"
+
+#include <QByteArray>
+#include <QStringList>
+
+#include <functional>
+#include <map>
+#include <vector>
+
+namespace lumora {
+
+// A lab in memory: an FTP server with folders and files, a web site that notes what it is asked, and faults by script.
+// The line in between may be down, the login refused, a put refused or cut in its middle, a delete refused.
+class FakeLab : public Internet {
+public:
+    // Folders by their path below the root, without a leading slash; the root itself is "".
+    using Folder = std::map<QString, QByteArray>;
+    std::map<QString, Folder> folders = {{QString(), {}}};
+
+    static constexpr int always = -1;
+
+    // How often from now on; always is for good.
+    int deadOpens = 0;      // the machine has no way out
+    int deadConnects = 0;   // nobody answers
+    int refusedLogins = 0;  // wrong user or password
+    int failedListings = 0; // the line is cut while a listing comes
+    bool refusesDelete = false;
+    bool refusesFolders = false; // no folder can be made
+    bool refusesEntry = false;   // the order's folder can't be entered
+    bool listsDots = false;      // "." and ".." stand in each listing
+
+    struct PutFault {
+        QString name; // empty: any file
+        int times = 1;
+        // -1: refused, nothing stored. Otherwise the line is cut once so many bytes are stored.
+        int cutAfter = -1;
+    };
+    std::vector<PutFault> putFaults;
+
+    // Runs as a put begins, as something that happens meanwhile.
+    std::function<void(const QString& name)> onPut;
+    // Runs as a connection is asked for; the number counts from 1.
+    std::function<void(int number)> onConnect;
+
+    // What the server saw.
+    QStringList puts;    // names, also of puts that failed
+    QStringList deletes; // names
+    int connects = 0;
+    QStringList urls; // in order, as the client gave them
+
+    bool open() override;
+    bool connectedState() const override { return deadOpens == 0; }
+    Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
+                                                      DataChannel channel) override;
+    Result<QByteArray> fetch(const QString& url) override;
+    Result<void> download(const QString& url, const HostPath& target) override;
+
+    DataChannel lastChannel = DataChannel::Passive;
+};
+
+} // namespace lumora
