@@ -48,7 +48,7 @@ void writePrintHead(ListOutput& log, const SessionState& state, const QDateTime&
     writeDetails(log, state.shemot);
 }
 
-// The numbers of the extras are the places of the session's lists, so that place 0 is not among them.
+// The extras are numbered from 1 here, from 0 in the session's lists: the last place of each list never travels.
 void writeAlbumHead(ListOutput& log, const SessionState& state, const QDateTime& now) {
     const AlbumDetails& album = state.album;
     log.pair(QStringLiteral("00"), QStringLiteral("00"));
@@ -69,9 +69,9 @@ void writeAlbumHead(ListOutput& log, const SessionState& state, const QDateTime&
     log.pair(QStringLiteral("SoogLBM"), album.SoogLBM);
     log.pair(QStringLiteral("SoogNiar"), album.SoogNiar);
     for (std::size_t i = 1; i < album.Tosafot1.size(); ++i)
-        log.pair(QStringLiteral("Tosafot1_%1").arg(i), album.Tosafot1[i]);
+        log.pair(QStringLiteral("Tosafot1_%1").arg(i), album.Tosafot1[i - 1]);
     for (std::size_t i = 1; i < album.Tosafot2.size(); ++i)
-        log.pair(QStringLiteral("Tosafot2_%1").arg(i), album.Tosafot2[i]);
+        log.pair(QStringLiteral("Tosafot2_%1").arg(i), album.Tosafot2[i - 1]);
 }
 
 void writeTail(ListOutput& log, const QStringList& items, const QStringList& failed) {
