@@ -338,35 +338,24 @@ void Form2::PackOnePicture(int index, Steps& steps) {
 
     // The picture before goes first, or a picture that can't be read would be printed as that one.
     Result<void> step = files.fileExists(steps.scratch) ? files.removeFile(steps.scratch) : Result<void>();
-    if (m_state.DchisaAmoka == 1) {
-        if (step)
-            step = files.copyFile(path, steps.scratch);
-        if (!step && step.failure().kind == Failure::Kind::NotFound)
-            step = {};
-    } else {
-        const Result<QByteArray> print = steps.nextPrint([this] { m_platform.pump.pump(); });
-        if (step && print)
-            step = files.writeWhole(steps.scratch, *print);
-    }
-    if (!step) {
+    const Result<QByteArray> picture =
+        m_state.DchisaAmoka == 1 ? files.read(path) : steps.nextPrint([this] { m_platform.pump.pump(); });
+    if (step && picture)
+        step = files.writeWhole(steps.scratch, *picture);
+    // What can't be read is the picture's own fault and stands in the list; the order's files are another matter.
+    if (!step || !picture) {
         addFailed(path);
-        tellWriteFailure(step.failure());
-        return;
-    }
-    if (!files.fileExists(steps.scratch)) {
-        addFailed(path);
+        if (!step)
+            tellWriteFailure(step.failure());
         return;
     }
 
     const QString base = PrintBaseName(path);
-    const Result<QByteArray> picture = files.read(steps.scratch);
-    const Result<QByteArray> packed =
-        !folderThere ? Result<QByteArray>(folderThere.failure())
-        : !picture   ? picture
-                     : packPrintFile(*picture, steps.shape, steps.tail.form(m_state.SugTzad, base));
-    if (picture)
-        m_manifestLine = QString::number(picture->size()) + QStringLiteral(">>") + codeOf(item) +
-                         QString::number(m_runningNumber) + u'_' + base + QStringLiteral(".jpg\r\n");
+    m_manifestLine = QString::number(picture->size()) + QStringLiteral(">>") + codeOf(item) +
+                     QString::number(m_runningNumber) + u'_' + base + QStringLiteral(".jpg\r\n");
+    const Result<QByteArray> packed = folderThere
+                                          ? packPrintFile(*picture, steps.shape, steps.tail.form(m_state.SugTzad, base))
+                                          : Result<QByteArray>(folderThere.failure());
     const QString name = PrintFileName{codeOf(item), index, m_state.Optint, base}.text();
     const Result<void> written =
         packed ? files.writeWhole(steps.folder.printFilePath(name), *packed) : Result<void>(packed.failure());

@@ -50,8 +50,8 @@ public:
     Caption Label16;        // how many pictures there are
     Caption Label4Progress; // a sentence: what is happening, with position and count
     Caption Label4Picture;  // file name of the picture in work
-    Caption Label4fail;     // a sentence: how many could not be prepared; empty when all could
-    Caption Label4removed;  // a sentence above List4removed; empty when nothing was dropped
+    Caption Label4fail;     // a sentence: how many could not be prepared; hidden when all could
+    Caption Label4removed;  // a sentence above List4removed; hidden when nothing was dropped
     Caption Label6;         // the warning not to delete the pictures yet, two lines
     Caption Label10;
     Caption Label1; // title of the page

@@ -75,14 +75,16 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
         QByteArray cutShort = *encodeJpeg(noisyPicture(60, 60, 1), 90);
         cutShort.truncate(cutShort.size() / 2);
         // What is copied as it is fails only where there is nothing to copy.
-        const QString second =
-            deep == 1 ? QStringLiteral("C:\\pics\\missing.jpg") : giveFile(QStringLiteral("second.jpg"), cutShort);
+        const QString nothing = QStringLiteral("C:\\pics\\nothing.jpg");
+        makeFolder(nothing);
+        const QString second = deep == 1 ? nothing : giveFile(QStringLiteral("second.jpg"), cutShort);
         Form2& page = openWith({line(first), line(second), line(third)});
         const TextList& failed = page.List4fail;
         page.Command6_Click();
 
         const QString number = state.MisparHazmana;
         EXPECT_EQ(failed.items(), QStringList(second));
+        EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << "the order's own files are all written";
         ASSERT_EQ(printFiles(number), QStringList({QStringLiteral("1 1015GNB0000_016669727374.jpp"),
                                                    QStringLiteral("1 1015GNB0002_017468697264.jpp")}))
             << "the failed picture leaves a hole in the numbers";
@@ -262,11 +264,13 @@ TEST_F(PreparingAPlainOrder, saysItsTextsInTheLanguageOfTheSession) {
 TEST_F(PreparingAPlainOrder, takesAnAlbumOrderThroughItsOwnSheetAndLog) {
     state.Optint = 10;
     state.shemot.ppr = QStringLiteral("30/60");
-    state.album.Tosafot1[1] = QStringLiteral("canvas");
+    state.album.Tosafot1[0] = QStringLiteral("canvas");
+    state.album.Tosafot2[7] = QStringLiteral("gilt");
     openWith({line(givePicture(QStringLiteral("one.jpg")))}).Command6_Click();
     const QByteArray log = *machine.files.read(logPath());
     EXPECT_TRUE(log.startsWith("\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"KeSherLaSharat\",\"0\"\r\n"));
     EXPECT_TRUE(log.contains("\"SoogNiar\",\"\"\r\n\"Tosafot1_1\",\"canvas\"\r\n"));
+    EXPECT_TRUE(log.contains("\"Tosafot2_7\",\"\"\r\n\"Tosafot2_8\",\"gilt\"\r\n\"More Comp = \",0\r\n"));
     EXPECT_EQ(log.count('\n'), 34 + 7 + 1);
     EXPECT_EQ(printFiles(), QStringList(QStringLiteral("1 1015GNB0000_106F6E65.jpp")));
     const Result<Bitmap> sheet = loadPicture(*machine.drives.toHost(folder() + QStringLiteral("\\!105_1234.jpp")));
