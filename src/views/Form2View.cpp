@@ -120,10 +120,11 @@ void Form2View::render()
     m_gauge->show(share, QString::number(m_page.progressValue),
                   all > 0 ? wording(u"מתוך %1"_s, u"of %1"_s).arg(all) : QString());
     m_gauge->setAccessibleName(m_page.Label4Progress.text.isEmpty() ? m_page.Label1.text : m_page.Label4Progress.text);
+    m_total->setVisible(!m_page.Label5.text.isEmpty());
     m_total->setText(wording(u"תמונות להדפסה: %1"_s, u"Prints: %1"_s).arg(m_page.Label5.text));
     m_sheet->setPicture(m_page.Picture5Image.image());
     m_sheetCard->setVisible(m_page.Picture5.visible && !m_page.Picture5Image.isNull());
-    m_trouble->setVisible(!m_page.Label4fail.text.isEmpty() || !m_page.Label4removed.text.isEmpty());
+    m_trouble->setVisible(m_page.Label4fail.visible || m_page.Label4removed.visible);
     m_removed->setVisible(!m_page.List4removed.isEmpty());
     m_listCard->setVisible(!m_page.preparing && !m_page.List1.isEmpty());
     if (m_page.preparing)
