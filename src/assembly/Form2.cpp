@@ -399,8 +399,8 @@ bool Form2::drawSheet(bool album) {
     sheet.drawLines(album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now));
     std::vector<SheetCell> cells;
     for (const QString& item : List1.items())
-        cells.push_back(
-            {m_platform.files.drives().toHost(pathOf(item)), item.left(2) + u'_' + RightPart(NameWithoutEnding(item), 9)});
+        cells.push_back({m_platform.files.drives().toHost(pathOf(item)),
+                         item.left(2) + u'_' + RightPart(NameWithoutEnding(item), 9)});
     setStage(Stage::Sheet);
     sheet.drawContactSheet(cells, [&](int i) {
         setStage(Stage::Sheet, i + 1);

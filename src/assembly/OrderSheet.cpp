@@ -35,6 +35,8 @@ const QString mixedSizes = QStringLiteral("zz/zz");
 // Pixels of a 96 dpi screen: 12 and 8 points.
 constexpr int lineFontPixels = 16;
 constexpr int captionFontPixels = 11;
+// From line to line, whatever the font would take: the seventeen lines of an album must end above its pictures.
+constexpr int linePitch = 20;
 constexpr QPoint textStart(10, 10);
 
 QFont sheetFont(int pixels) {
@@ -168,7 +170,7 @@ void OrderSheet::drawLines(const QStringList& lines) {
         QString text = line;
         for (const QString& part : text.remove(u'\r').split(u'\n')) {
             drawTextLine(painter, textStart.x(), top, part);
-            top += painter.fontMetrics().lineSpacing();
+            top += linePitch;
         }
     }
 }

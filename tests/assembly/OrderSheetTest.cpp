@@ -154,6 +154,12 @@ TEST_F(ContactSheet, writesTheLinesAboveThePictures) {
     EXPECT_EQ(sheet.bitmap().image().copy(0, 0, 500, 8), empty.copy(0, 0, 500, 8));
     EXPECT_EQ(sheet.bitmap().image().copy(0, 161, 500, 300), empty.copy(0, 161, 500, 300))
         << "six lines end above the pictures";
+
+    OrderSheet album(SheetKind::Album, {500, 480}, Qt::white);
+    album.drawLines(albumSheetLines(state, QDateTime()));
+    EXPECT_NE(album.bitmap().image().copy(0, 330, 500, 20), empty.copy(0, 330, 500, 20));
+    EXPECT_EQ(album.bitmap().image().copy(0, 362, 500, 100), empty.copy(0, 362, 500, 100))
+        << "and so do an album's seventeen";
 }
 
 } // namespace
