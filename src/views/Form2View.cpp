@@ -79,12 +79,11 @@ Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     setRole(m_listCard, "card");
     auto* listColumn = new QVBoxLayout(m_listCard);
     listColumn->setContentsMargins(theme.px(16), theme.px(12), theme.px(16), theme.px(16));
-    auto* list = new QListWidget(m_listCard);
-    speak(list, u"List1"_s);
-    connect(list, &QListWidget::itemClicked, this, [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
-    connect(list, &QListWidget::itemActivated, this, [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
-    bindList(u"List1"_s, page.List1, list, [](const QString& line) { return LeafName(line); });
-    listColumn->addWidget(list, 1);
+    m_list = new QListWidget(m_listCard);
+    connect(m_list, &QListWidget::itemClicked, this, [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
+    connect(m_list, &QListWidget::itemActivated, this, [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
+    bindList(u"List1"_s, page.List1, m_list, [](const QString& line) { return LeafName(line); });
+    listColumn->addWidget(m_list, 1);
     listColumn->addWidget(button(u"Command1"_s, page.Command1, Role::Plain, [this] { m_page.Command1_Click(); }, u"trash"_s));
     side->addWidget(m_listCard, 4);
     row->addLayout(side, 2);
@@ -125,6 +124,9 @@ void Form2View::render()
     m_sheet->setPicture(m_page.Picture5Image.image());
     m_sheetCard->setVisible(m_page.Picture5.visible && !m_page.Picture5Image.isNull());
     m_trouble->setVisible(m_page.Label4fail.visible || m_page.Label4removed.visible);
+    speak(m_removed, m_page.Label4removed.text);
+    speak(m_list, wording(u"התמונות שבהזמנה"_s, u"The pictures of the order"_s));
+    speak(m_sheet, m_page.Picture5.text);
     m_removed->setVisible(!m_page.List4removed.isEmpty());
     m_listCard->setVisible(!m_page.preparing && !m_page.List1.isEmpty());
     if (m_page.preparing)

@@ -5,7 +5,6 @@
 
 class QFrame;
 class QListWidget;
-class QProgressBar;
 
 namespace lumora {
 
@@ -28,6 +27,7 @@ private:
     QFrame* m_sheetCard;
     QFrame* m_trouble;
     QListWidget* m_removed;
+    QListWidget* m_list;
     QFrame* m_listCard;
     QPushButton* m_start;
     QLabel* m_total;
