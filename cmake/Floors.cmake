@@ -9,6 +9,8 @@ target_compile_options(lumora_options INTERFACE
 target_compile_definitions(lumora_options INTERFACE
   QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_NO_KEYWORDS LUMORA_VERSION="${PROJECT_VERSION}")
 if(LUMORA_SANITIZE)
+  # With its checks woven in, the compiler no longer sees that a value is always set.
+  target_compile_options(lumora_options INTERFACE -Wno-maybe-uninitialized)
   target_compile_options(lumora_options INTERFACE -fsanitize=${LUMORA_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=undefined)
   target_link_options(lumora_options INTERFACE -fsanitize=${LUMORA_SANITIZE})
 endif()
