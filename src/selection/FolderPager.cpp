@@ -26,7 +26,8 @@ void FolderPager::clear() {
 int FolderPager::addFolder(const QString& folder, const QStringList& names) {
     const int lastBefore = m_paths.lastIndex();
     for (const QString& name : names) {
-        if (IsInFolderList(folder + name))
+        // Only a root ends in the backslash that makes a path of the two: "1.jpg" of a folder "a" is not "a1.jpg".
+        if (folder.endsWith(u'\\') && IsInFolderList(folder + name))
             continue;
         const QString path = JoinDrivePath(folder, name);
         m_paths.append(path);

@@ -257,10 +257,8 @@ void kyoskNew::showLarge(const QString& path) {
     const PictureSize view = largeViewSize(*size);
     const double scale = static_cast<double>(m_cellPixels) / cellSize;
     const auto pixels = [scale](int units) { return std::max(1, static_cast<int>(std::lround(units * scale))); };
-    const bool lies = m_rotation % 180 != 0;
-    // Drawn to fill the view in each of the four positions.
-    const Result<Bitmap> picture =
-        loadPictureScaled(host, {pixels(lies ? view.height : view.width), pixels(lies ? view.width : view.height)});
+    // A quarter turn exchanges the sides of the view; the picture keeps its proportions.
+    const Result<Bitmap> picture = loadPictureScaled(host, {pixels(view.width), pixels(view.height)});
     if (!picture)
         return;
     Picture2.bitmap =

@@ -27,6 +27,7 @@ void kyoskNew::Command3_Click() {
     fillDomains();
     if (couponRefuses())
         return;
+    m_state.DchisaAmoka = 0; // that of an order before is none of this one
     if (plain())
         FinishSimple();
     else
@@ -69,7 +70,8 @@ void kyoskNew::closeFinish() {
 
 void kyoskNew::FinishSimple() {
     const DeepCompression deep = deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa);
-    m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
+    if (deep == DeepCompression::On)
+        m_state.DchisaAmoka = 1;
     Picture7.visible = deep == DeepCompression::Ask;
     if (!openClosingPanel())
         return;

@@ -209,6 +209,12 @@ TEST(AFolderPager, doublesAnOrdinaryFolderButNoDriveRoot) {
     EXPECT_EQ(pager.currentIndex(), position);
 }
 
+TEST(AFolderPager, takesNoPictureOfAFolderForOneBesideIt) {
+    FolderPager pager;
+    pager.addFolder(QStringLiteral("C:\\p"), {QStringLiteral("a01.jpg")});
+    EXPECT_EQ(pager.addFolder(QStringLiteral("C:\\p\\a"), names(2)), 2);
+}
+
 TEST(AFolderPager, goesBackByThePageInViewAndTheOneBefore) {
     for (const auto& [pages, firstAfterBack] : {std::pair{1, 1}, {2, 1}, {3, 13}, {4, 25}}) {
         FolderPager pager;

@@ -214,10 +214,10 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
     EXPECT_EQ(page.Label6.text, QStringLiteral("  איכות נמוכה מאוד  30 / 40"));
     EXPECT_TRUE(page.Picture2.warning);
     EXPECT_EQ(page.Picture2.bitmap.width(), 400);
-    for (int i = 0; i < 4; ++i) {
+    for (const int width : {300, 400, 300, 400}) {
         page.Image4_Click();
-        EXPECT_EQ(page.Picture2.bitmap.width(), 400);
-        EXPECT_EQ(page.Picture2.bitmap.height(), 300);
+        EXPECT_EQ(page.Picture2.bitmap.width(), width);
+        EXPECT_EQ(page.Picture2.bitmap.height(), 700 - width);
     }
     // At exactly 800000 pixels the text of the picture before stays, and no warning is painted.
     pick(page, QStringLiteral("C:\\q\\01.jpg"));
@@ -410,7 +410,7 @@ TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
         static_cast<void>(machine.files.removeFile(first));
         state.Optint = static_cast<std::int16_t>(mode);
         state.MediniyutDchisa = static_cast<std::int16_t>(policy);
-        state.DchisaAmoka = 0;
+        state.DchisaAmoka = 1; // of an order before
         chain.unload(PageId::kyoskNew);
         kyoskNew& page = openWith(1);
         page.Picture1_Click(0);
