@@ -38,6 +38,7 @@ struct Program::Parts {
         , dialogs(window, state, files)
         , platform{files, dialogs, internet, shell, clock, pump, volume}
     {
+        dialogs.beforePick = [this] { drives.refreshMedia(); };
     }
 
     Deployment deployment;

@@ -107,26 +107,36 @@ void Drives::refreshMedia() {
                 found.push_back(folder);
         }
     }
-    std::erase_if(
-        m_media, [&](const auto& drive) { return std::find(found.begin(), found.end(), drive.second) == found.end(); });
+    const auto isGone = [&](const auto& drive) {
+        return std::find(found.begin(), found.end(), drive.second) == found.end();
+    };
+    const auto takeLetter = [this](const HostPath& folder) {
+        for (char16_t letter = u'D'; letter < u'Z'; ++letter) {
+            if (letter != m_programLetter && m_media.try_emplace(letter, folder).second)
+                return true;
+        }
+        return false;
+    };
     for (const HostPath& folder : found) {
         const bool known =
             std::any_of(m_media.begin(), m_media.end(), [&](const auto& drive) { return drive.second == folder; });
         if (known)
             continue;
-        for (char16_t letter = u'D'; letter < u'Z'; ++letter) {
-            if (letter != m_programLetter && !m_media.contains(letter)) {
-                m_media.emplace(letter, folder);
-                break;
-            }
+        // A medium that was taken out keeps its letter: cards number their pictures alike, and a path of the first card
+        // must never lead to a picture of the second. Only when all letters are gone are those given anew.
+        if (!takeLetter(folder)) {
+            std::erase_if(m_media, isGone);
+            takeLetter(folder);
         }
     }
 }
 
 std::vector<Drives::Drive> Drives::drives() const {
     std::vector<Drive> all = {{m_programLetter, m_dataFolder, toText(m_dataFolder.filename()), false}};
-    for (const auto& [letter, folder] : m_media)
-        all.push_back({letter, folder, toText(folder.filename()), true});
+    for (const auto& [letter, folder] : m_media) {
+        if (holdsMedium(folder))
+            all.push_back({letter, folder, toText(folder.filename()), true});
+    }
     if (m_programLetter != rootLetter)
         all.push_back({rootLetter, "/", QStringLiteral("/"), false});
     return all;

@@ -18,7 +18,7 @@ namespace lumora {
 class Drives {
 public:
     // mediaRoots: folders whose sub-folders are mounted media, as /media/<user>/CARD and /run/media/<user>/CARD. A
-    // medium that appears twice takes one letter; a medium keeps its letter while it stays mounted.
+    // medium that appears twice takes one letter; a medium keeps its letter, also when it is taken out meanwhile.
     Drives(HostPath dataFolder, QChar programLetter = u'C', std::vector<HostPath> mediaRoots = defaultMediaRoots());
 
     static std::vector<HostPath> defaultMediaRoots();

@@ -90,6 +90,8 @@ bool ScreenDialogs::ask(const QString& question)
 
 QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title)
 {
+    if (beforePick)
+        beforePick();
     if (nextPick) {
         if (const std::optional<QString> pick = nextPick())
             return *pick;

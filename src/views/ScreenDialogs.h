@@ -28,6 +28,9 @@ public:
     bool ask(const QString& question) override;
     QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override;
 
+    // Runs before a picture is picked, so that cards put in meanwhile are found.
+    std::function<void()> beforePick;
+
     // Answers given in place of a person's; no value lets the panel come up. A pick is a drive path, empty for a
     // cancel.
     std::function<std::optional<QString>()> nextPick;

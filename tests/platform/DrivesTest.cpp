@@ -59,7 +59,7 @@ TEST_F(DrivesTest, RefusesWhatIsNoPathOfADrive) {
     EXPECT_FALSE(drives.toHost(QStringLiteral("C:\\a") + QChar(0) + u'b'));
 }
 
-TEST_F(DrivesTest, KeepsTheLetterOfACardWhileItIsMounted) {
+TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
     insertCard("ONE");
     insertCard("TWO");
     fs::create_directories(media / "cdrom"); // a place without a medium
@@ -70,14 +70,16 @@ TEST_F(DrivesTest, KeepsTheLetterOfACardWhileItIsMounted) {
 
     fs::remove_all(media / "ONE");
     drives.refreshMedia();
-    EXPECT_FALSE(drives.toHost(QStringLiteral("D:\\a.jpg")));
+    EXPECT_EQ(drives.drives().size(), 3U);
     EXPECT_EQ(drives.toDrive(media / "TWO"), QStringLiteral("F:\\"));
 
     insertCard("THREE");
     drives.refreshMedia();
-    EXPECT_EQ(drives.toDrive(media / "THREE"), QStringLiteral("D:\\"));
-    const auto all = drives.drives();
-    EXPECT_EQ(std::count_if(all.begin(), all.end(), [](const auto& drive) { return drive.removable; }), 2);
+    EXPECT_EQ(drives.toDrive(media / "THREE"), QStringLiteral("G:\\"));
+    EXPECT_EQ(drives.drives().size(), 4U);
+    insertCard("ONE");
+    drives.refreshMedia();
+    EXPECT_EQ(drives.toDrive(media / "ONE"), QStringLiteral("D:\\"));
 }
 
 TEST_F(DrivesTest, CountsAMediumThatShowsTwiceOnce) {
