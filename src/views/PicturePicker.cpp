@@ -12,6 +12,7 @@
 #include <QPainter>
 #include <QPushButton>
 #include <QKeyEvent>
+#include <QMouseEvent>
 #include <QStandardPaths>
 #include <QStyledItemDelegate>
 #include <QVBoxLayout>
@@ -97,6 +98,14 @@ protected:
         else
             QListWidget::keyPressEvent(event);
     }
+
+    // The first click of the two may have opened a folder; the second is not meant for what lies there now.
+    void mouseDoubleClickEvent(QMouseEvent* event) override
+    {
+        const QListWidgetItem* item = itemAt(event->position().toPoint());
+        if (item && item->isSelected())
+            QListWidget::mouseDoubleClickEvent(event);
+    }
 };
 
 QString nameOf(const HostPath& path)
@@ -135,6 +144,11 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     head->setText(isolated(prompt.trimmed()));
     head->setObjectName(u"pickerPrompt"_s);
     column()->addWidget(head);
+    auto* guide = makeLabel(this, "body");
+    guide->setText(isolated(state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                                          u"Select only one image of a folder and the program will show you all the images"_s)));
+    guide->setObjectName(u"pickerGuide"_s);
+    column()->addWidget(guide);
 
     auto* middle = new QHBoxLayout;
     middle->setSpacing(theme.wideGap());

@@ -14,6 +14,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QScreen>
 #include <QStackedLayout>
 #include <QVBoxLayout>
 
@@ -352,7 +353,6 @@ void kyoskNewView::makeBranchPanel()
     m_branches->column()->addLayout(row);
     m_branches->column()->addWidget(button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
                                     Qt::AlignLeading);
-    m_branches->setFirstFocus(m_branchButtons[0]);
     connect(m_branches, &Overlay::escaped, this, [this] { m_page.Command28_Click(); });
     frame().addSecondaryAction(button(u"Image33"_s, m_page.Image33, Role::Secondary, [this] { m_page.Image33_Click(); }, u"shop"_s));
     // The card beside the buttons follows the mouse and the keyboard alike.
@@ -441,7 +441,10 @@ void kyoskNewView::showEvent(QShowEvent* event)
 
 void kyoskNewView::fitCells()
 {
-    if (!isDetached() && isVisible() && m_cells[0]->width() > 40)
+    if (isDetached() || !isVisible())
+        return;
+    m_page.setScreenHeight(screen()->size().height());
+    if (m_cells[0]->width() > 40)
         m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
 }
 
@@ -531,9 +534,12 @@ void kyoskNewView::render()
     m_leave->setOpen(m_page.Frame3.visible);
     m_help->setOpen(m_page.Frame2.visible);
     renderClosing();
-    for (QPushButton* branch : m_branchButtons) {
-        if (branch->text().isEmpty())
-            branch->hide();
+    // A lab with fewer shops leaves captions empty; the panel opens on the first branch there is.
+    for (auto at = m_branchButtons.rbegin(); at != m_branchButtons.rend(); ++at) {
+        if ((*at)->text().isEmpty())
+            (*at)->hide();
+        else
+            m_branches->setFirstFocus(*at);
     }
     m_branches->setOpen(m_page.Pic4snifim.visible);
     m_compression->setOpen(m_page.Picture7.visible);
