@@ -2,9 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
-#include "platform/Dialogs.h"
 #include "platform/Files.h"
-#include "platform/Platform.h"
 #include "session/TextList.h"
 
 #include <algorithm>
@@ -15,13 +13,11 @@ QString BrokenFilesPath(const QString& orderFolder) {
     return JoinDrivePath(orderFolder, QStringLiteral("kashloo.txt"));
 }
 
-void WriteBrokenFiles(const Platform& platform, const QString& orderFolder, const TextList& broken) {
+Result<void> WriteBrokenFiles(const Files& files, const QString& orderFolder, const TextList& broken) {
     QByteArray bytes;
     for (const QString& path : broken.items())
         bytes += AnsiCodePage::encode(path) + "\r\n";
-    const auto written = platform.files.writeWhole(BrokenFilesPath(orderFolder), bytes);
-    if (!written)
-        platform.dialogs.message(written.failure().message);
+    return files.writeWhole(BrokenFilesPath(orderFolder), bytes);
 }
 
 QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder) {

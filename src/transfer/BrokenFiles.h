@@ -1,5 +1,7 @@
 #pragma once
 
+#include "common/Result.h"
+
 #include <QString>
 #include <QStringList>
 
@@ -7,13 +9,13 @@ namespace lumora {
 
 class Files;
 class TextList;
-struct Platform;
 
 // kashloo.txt in the local order folder: the files whose put failed, one full local path a line. It outlives the
 // program, so that what a broken put left on the server is not taken for a sent file when the order is sent again. A
-// write that fails is told.
+// write that fails is for the caller to
+// tell.
 QString BrokenFilesPath(const QString& orderFolder);
-void WriteBrokenFiles(const Platform& platform, const QString& orderFolder, const TextList& broken);
+Result<void> WriteBrokenFiles(const Files& files, const QString& orderFolder, const TextList& broken);
 // Empty when there is no such file.
 QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder);
 

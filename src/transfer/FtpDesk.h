@@ -18,6 +18,9 @@ struct FtpDesk {
     std::function<void()> changed;
     // The customer has left the page or the program: every loop ends at its next step and nothing more is sent.
     bool left = false;
+    // The customer has asked to stop the sending. Read at the head of each file and within it, between two tries to
+    // reach the server, and behind a check; reset where a file begins.
+    bool StopFlag = false;
 
     QString wording(const QString& hebrew, const QString& inEnglish) const { return state.wording(hebrew, inEnglish); }
 

@@ -33,6 +33,12 @@ FtpFrm::FtpFrm(SessionState& state, const Platform& platform, PageChain& chain)
         if (page == this)
             QTimer::singleShot(0, this, &FtpFrm::activateWhenFree);
     });
+    // The window may be closed, and the page unloaded, while a pass runs inside a pump: it must not go on unseen.
+    connect(&chain, &PageChain::ended, this, &FtpFrm::leavePage);
+    connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
+        if (page == this)
+            leavePage();
+    });
 }
 
 FtpFrm::~FtpFrm() = default;
@@ -81,6 +87,8 @@ void FtpFrm::Form_Activate() {
         Command13_Click();
     else if (m_state.transfer.SugMishloah == 1)
         Command1_Click();
+    else
+        enter(Phase::NoOrder);
 }
 
 void FtpFrm::setTexts() {
@@ -155,6 +163,15 @@ void FtpFrm::setPanelTexts() {
 void FtpFrm::showWhatToDo() {
     QString& text = Label4Do.text;
     switch (m_phase) {
+    case Phase::Preparing:
+        text = m_state.wording(QStringLiteral("קוראים את ההזמנה. נא להמתין."),
+                               QStringLiteral("Reading the order. Please wait."));
+        break;
+    case Phase::NoServer:
+        text = m_state.wording(QStringLiteral("לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות."),
+                               QStringLiteral("No server is set for orders. The order is kept on this computer. Please "
+                                              "tell the shop."));
+        break;
     case Phase::NoOrder:
         text =
             m_state.wording(QStringLiteral("אין כאן הזמנה לשליחה."), QStringLiteral("There is no order to send here."));
@@ -175,6 +192,10 @@ void FtpFrm::showWhatToDo() {
         text = m_state.wording(QStringLiteral("בודקים אילו קבצים הגיעו לשרת. נא להמתין."),
                                QStringLiteral("Checking which files have arrived. Please wait."));
         break;
+    case Phase::Reporting:
+        text = m_state.wording(QStringLiteral("כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין."),
+                               QStringLiteral("The whole order has arrived. Telling the shop, please wait."));
+        break;
     case Phase::Success:
         text = m_state.wording(QStringLiteral("כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה."),
                                QStringLiteral("The whole order has arrived. You can close, or begin a new order."));
@@ -188,21 +209,37 @@ void FtpFrm::showWhatToDo() {
                                QStringLiteral("Sending was stopped. Press Send again to go on."));
         break;
     case Phase::Silent:
-        text =
-            m_state
-                .wording(QStringLiteral("הגיעו %1 מתוך %2 קבצים. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח שוב."),
-                         QStringLiteral("%1 of %2 files have arrived. Press Send again to check and send once more."))
-                .arg(m_room->check.NumOnServer)
-                .arg(NumToSend);
+        text = silentEndText();
         break;
     }
 }
 
+// The counts differ and yet the verification has no verdict.
+QString FtpFrm::silentEndText() const {
+    const bool all = m_room->check.missing().isEmpty() && m_room->check.NumOnServer > NumToSend;
+    return (all ? m_state.wording(QStringLiteral("כל %2 הקבצים של משלוח זה נמצאים בשרת, ובתיקייה שם %1 קבצים. אין צורך "
+                                                 "לשלוח שוב. יש להודיע על כך לחנות."),
+                                  QStringLiteral("All %2 files of this sending are on the server, whose folder holds "
+                                                 "%1. There is no need to send again. Please tell the shop."))
+                : m_state.wording(QStringLiteral("הגיעו %1 מתוך %2 קבצים. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח "
+                                                 "שוב. אם זה חוזר, יש להודיע לחנות."),
+                                  QStringLiteral("%1 of %2 files have arrived. Press Send again to check and send once "
+                                                 "more. If this comes again, please tell the shop.")))
+        .arg(m_room->check.NumOnServer)
+        .arg(NumToSend);
+}
+
 void FtpFrm::enter(Phase phase) {
     m_phase = phase;
-    sending = phase == Phase::Sending || phase == Phase::Checking;
-    // A stop is read while files travel; a check takes none, and a new pass would forget it.
-    Command15.enabled = Command21.enabled = phase == Phase::Sending;
+    sending = phase == Phase::Sending || phase == Phase::Checking || phase == Phase::Reporting;
+    Command15.enabled = Command21.enabled = phase == Phase::Sending || phase == Phase::Checking;
+    const bool nothing = phase == Phase::NoOrder || phase == Phase::NoServer;
+    const bool resumable = phase == Phase::NotAll || phase == Phase::Stopped || phase == Phase::Silent;
+    Image5.visible = !nothing && phase != Phase::Success;
+    Command23.visible = !nothing;
+    // The order stays in its folder, so that what is missing can be sent.
+    Command10.visible = resumable;
+    Command28.visible = nothing || resumable || phase == Phase::Success;
     setButtonTexts();
     showWhatToDo();
     Q_EMIT changed();
@@ -258,10 +295,14 @@ void FtpFrm::Command18_Click() {
 }
 
 void FtpFrm::Command15_Click() {
-    m_room->pass.StopFlag = true;
-    if (sending)
-        m_room->desk.status(m_state.wording(QStringLiteral("נעצר לאחר הקובץ הנוכחי"),
-                                            QStringLiteral("Stopping after the present file")));
+    if (m_phase != Phase::Sending && m_phase != Phase::Checking)
+        return;
+    m_room->desk.StopFlag = true;
+    Command15.enabled = Command21.enabled = false;
+    const QString stopping =
+        m_state.wording(QStringLiteral("נעצר לאחר הקובץ הנוכחי"), QStringLiteral("Stopping after the present file"));
+    Label4Do.text = stopping; // the status line goes on with what happens meanwhile
+    m_room->desk.status(stopping);
 }
 
 void FtpFrm::Command21_Click() {
@@ -269,7 +310,7 @@ void FtpFrm::Command21_Click() {
 }
 
 void FtpFrm::Command10_Click() {
-    if (sending || AllDone == 1)
+    if (sending || AllDone == 1 || m_phase == Phase::Preparing)
         return;
     m_room->pass.UserStopped = 0;
     List3.clear();
@@ -279,7 +320,7 @@ void FtpFrm::Command10_Click() {
 }
 
 void FtpFrm::Image5_Click() {
-    if (sending || AllDone == 1)
+    if (sending || AllDone == 1 || m_phase == Phase::Preparing)
         return;
     stopTimers();
     m_room->session.RoundNo = 0;
@@ -287,12 +328,16 @@ void FtpFrm::Image5_Click() {
 }
 
 void FtpFrm::leaveProgram() {
+    leavePage();
+    m_chain.endProgram();
+}
+
+void FtpFrm::leavePage() {
     m_room->desk.left = true;
     stopTimers();
     // A pass that is under way may stand in a call of the session; it closes at its next step.
     if (!sending)
         m_room->session.closeSession();
-    m_chain.endProgram();
 }
 
 void FtpFrm::Image3_Click() {
@@ -307,7 +352,8 @@ void FtpFrm::Image3_Click() {
 
 void FtpFrm::Command14_Click() {
     Picture7.visible = false;
-    if (!sending && AllDone == 0 && !List4Makor.isEmpty()) {
+    // After a stop or a failure nothing goes out until the customer says so.
+    if (m_phase == Phase::Countdown || m_phase == Phase::Waiting) {
         Timer1.start();
         enter(Phase::Countdown);
     }
@@ -329,9 +375,6 @@ void FtpFrm::Command8_Click() {
 void FtpFrm::Command28_Click() {
     if (sending)
         return;
-    stopTimers();
-    m_room->desk.left = true;
-    m_room->session.closeSession();
     m_chain.show(PageId::hatchala);
     m_chain.unload(PageId::FtpFrm);
 }

@@ -89,7 +89,20 @@ public:
     void AskAfterFatalError();
 
 private:
-    enum class Phase { NoOrder, Countdown, Waiting, Sending, Checking, Success, NotAll, Stopped, Silent };
+    enum class Phase {
+        Preparing, // the order's folder is being read: start controls would find nothing yet
+        NoOrder,
+        NoServer,
+        Countdown,
+        Waiting,
+        Sending,
+        Checking,
+        Reporting,
+        Success,
+        NotAll,
+        Stopped,
+        Silent,
+    };
 
     // FtpFrm.cpp
     void activateWhenFree();
@@ -98,6 +111,8 @@ private:
     void showWhatToDo();
     void enter(Phase phase);
     void leaveProgram();
+    void leavePage();
+    QString silentEndText() const;
     void stopTimers();
     void addProofPicture();
 
@@ -127,7 +142,7 @@ private:
     PageChain& m_chain;
     std::unique_ptr<UploadRoom> m_room; // the rules at work
     QStringList m_handedOver;           // the lines that the finished-orders page gave
-    Phase m_phase = Phase::NoOrder;
+    Phase m_phase = Phase::Preparing;
     bool m_activated = false;
     // Asked for by Command26, set by no page.
     bool m_proofWanted = false;

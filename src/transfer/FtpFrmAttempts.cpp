@@ -33,7 +33,7 @@ const std::array<AttemptTitle, attempts>& attemptTitles() {
 } // namespace
 
 void FtpFrm::Command12_Click() {
-    if (sending || AllDone == 1 || m_room->desk.left)
+    if (sending || AllDone == 1 || m_phase == Phase::Preparing || m_room->desk.left)
         return;
     enter(Phase::Sending);
     const Phase end = RunAttempts();
@@ -52,8 +52,7 @@ FtpFrm::Phase FtpFrm::RunAttempts() {
     Label34.text.clear();
     Label4Reason.text.clear();
     Label4Reason.visible = false;
-    Command10.visible = false;
-    Command28.visible = false;
+    Label34.visible = true;
     for (int attempt = 1; attempt <= attempts; ++attempt) {
         if (attempt > 1) {
             const AttemptTitle& title = attemptTitles()[static_cast<std::size_t>(attempt - 1)];
@@ -81,6 +80,11 @@ FtpFrm::Phase FtpFrm::RunAttempts() {
         const bool arrived = checkAttempt(attempt);
         if (room.desk.left)
             return Phase::Silent;
+        // A stop cuts the check short; what it still saw itself counts.
+        if (room.desk.StopFlag && !(arrived && room.check.freshCount)) {
+            room.pass.tellStopped();
+            return Phase::Stopped;
+        }
         if (attempt == attempts && room.check.NumOnServer <= NumToSend)
             Image6.visible = true;
         if (arrived) {
@@ -128,6 +132,7 @@ void FtpFrm::showFailure() {
     showNotAll();
     Label2.visible = true;
     Label9.visible = true;
+    Label4Reason.visible = false; // said in Label2
     Label2.text = Label4Reason.text.isEmpty()
                       ? m_state.wording(QStringLiteral("חלק מהקבצים לא הגיעו לשרת."),
                                         QStringLiteral("Some of the files did not arrive at the server."))
@@ -137,6 +142,7 @@ void FtpFrm::showFailure() {
 
 void FtpFrm::SendSuccess() {
     AllDone = 1;
+    enter(Phase::Reporting);
     for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
         control->visible = false;
     File1Enabled.enabled = false;
@@ -158,7 +164,6 @@ void FtpFrm::SendSuccess() {
     m_room->desk.captionFollowsStatus();
     Command12.enabled = false;
     Picture2.visible = true;
-    Image5.visible = false;
     Image4.visible = false;
     percent = 100;
     PicInProgWidth = Pic4ProgWidth;
@@ -170,9 +175,10 @@ void FtpFrm::finish(Phase phase) {
     Label4File.text.clear();
     Picture1.visible = false;
     File1Enabled.enabled = phase != Phase::Success;
-    // The order stays in its folder, so that Command10 can send what is missing.
-    Command10.visible = phase != Phase::Success;
-    Command28.visible = true;
+    if (phase == Phase::Success) {
+        Picture7.visible = false; // its warning no longer holds
+        Label34.visible = false;
+    }
     if (phase == Phase::NotAll) {
         Command12.visible = true;
         Command12.enabled = false;

@@ -56,8 +56,8 @@ void FtpFrm::Command4_Click() {
     for (int round = 1; round <= bulkRounds; ++round) {
         enter(Phase::Sending);
         stopTimers();
-        room.pass.StopFlag = false;
-        for (int i = 0; i < List3.count() && room.session.ConnectFails <= bulkConnectFails && !room.pass.StopFlag &&
+        room.desk.StopFlag = false;
+        for (int i = 0; i < List3.count() && room.session.ConnectFails <= bulkConnectFails && !room.desk.StopFlag &&
                         !room.desk.left;
              ++i) {
             List3.setCurrentIndex(i);
@@ -66,7 +66,7 @@ void FtpFrm::Command4_Click() {
         }
         if (room.desk.left)
             return;
-        if (room.pass.StopFlag) {
+        if (room.desk.StopFlag) {
             room.pass.tellStopped();
             end = Phase::Stopped;
             break;
@@ -75,9 +75,14 @@ void FtpFrm::Command4_Click() {
         room.check.ListServerFiles();
         if (room.desk.left)
             return;
-        if (room.check.NumOnServer == NumToSend) {
+        if (room.check.NumOnServer == NumToSend && (room.check.freshCount || !room.desk.StopFlag)) {
             SendSuccess();
             end = Phase::Success;
+            break;
+        }
+        if (room.desk.StopFlag) {
+            room.pass.tellStopped();
+            end = Phase::Stopped;
             break;
         }
         if (room.check.NumOnServer < NumToSend) {

@@ -17,6 +17,8 @@ namespace lumora {
 bool FtpFrm::settingsFound() {
     if (CheckFtpSettings(m_state))
         return true;
+    stopTimers();
+    enter(Phase::NoServer);
     m_platform.dialogs.message(
         m_state.wording(QStringLiteral("המחשב לא מצא שרת זמין\rנסה במועד מאוחר יותר"),
                         QStringLiteral("The computer found no available server.\rTry at a later time.")));
@@ -39,6 +41,8 @@ void FtpFrm::beginList() {
     NumToSend = 0;
     m_room->check.NumOnServer = 0;
     m_state.transfer.ShemTikiya = LeafName(m_state.transfer.OrderFolder);
+    if (orderIsChosen())
+        Label46.text = m_state.transfer.ShemTikiya;
 }
 
 void FtpFrm::listFolder() {
@@ -116,6 +120,7 @@ void FtpFrm::armCountdown() {
 void FtpFrm::Command13_Click() {
     if (sending || !settingsFound())
         return;
+    enter(Phase::Preparing);
     listFolder();
     armCountdown();
 }
@@ -123,6 +128,7 @@ void FtpFrm::Command13_Click() {
 void FtpFrm::Command1_Click() {
     if (sending || !settingsFound())
         return;
+    enter(Phase::Preparing);
     beginList();
     m_handedOver = m_state.handOver.lines;
     m_state.handOver.lines.clear();

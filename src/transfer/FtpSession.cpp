@@ -3,6 +3,7 @@
 #include "common/DrivePathText.h"
 #include "platform/Dialogs.h"
 #include "platform/Files.h"
+#include "transfer/BrokenFiles.h"
 #include "transfer/LineTrouble.h"
 
 #include <utility>
@@ -41,6 +42,7 @@ void FtpSession::beginPass() {
     RoundNo = 0;
     m_noLineTold = false;
     m_noSessionTold = false;
+    m_noListKeptTold = false;
 }
 
 void FtpSession::takeSettings() {
@@ -100,8 +102,10 @@ void FtpSession::FtpConnectServer() {
             m_board.chkPassive.checked ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
         int count = 0;
         Failure last = noLine();
-        while (count < connectAttempts && !hConnection && !m_desk.left) {
+        while (count < connectAttempts && !hConnection && !m_desk.left && !m_desk.StopFlag) {
             m_desk.pump();
+            if (m_desk.StopFlag)
+                break;
             ++count;
             if (m_desk.wholeFiles())
                 m_desk.status(QString::number(count) +
@@ -115,6 +119,8 @@ void FtpSession::FtpConnectServer() {
         }
         if (!hConnection) {
             bActiveSession = false;
+            if (m_desk.StopFlag)
+                return;
             tell(LineStep::Connect, last);
             m_desk.status(m_desk.wording(QStringLiteral("אין תקשורת עם השרת לאחר מספר נסיונות"),
                                          QStringLiteral("No contact with the server after several attempts: ")) +
@@ -289,6 +295,13 @@ bool FtpSession::FtpSendFile(const QString& path) {
     PauseBar();
     m_board.List4Broken.append(path);
     return false;
+}
+
+void FtpSession::keepBrokenFiles() {
+    const auto written =
+        WriteBrokenFiles(m_desk.platform.files, m_desk.state.transfer.OrderFolder, m_board.List4Broken);
+    if (!written && !std::exchange(m_noListKeptTold, true))
+        m_desk.platform.dialogs.message(written.failure().message);
 }
 
 void FtpSession::remove(const QString& remoteName) {

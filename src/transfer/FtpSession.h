@@ -46,6 +46,8 @@ public:
 
     // One put. False if it failed, which LogList, List7 and List4Broken then tell; nothing happens without a session.
     bool FtpSendFile(const QString& path);
+    // kashloo.txt as List4Broken is now. A write that fails is told once a pass.
+    void keepBrokenFiles();
     // The answer is not examined: deleting what is not there is normal here.
     void remove(const QString& remoteName);
 
@@ -107,6 +109,7 @@ private:
     // A pass asks for a session for each file; its boxes come once.
     bool m_noLineTold = false;
     bool m_noSessionTold = false;
+    bool m_noListKeptTold = false;
 };
 
 // True when the profile names a host, a user and a password.

@@ -98,6 +98,7 @@ void UploadCheck::tellCount(const QString& hebrew) {
 }
 
 void UploadCheck::ListServerFiles() {
+    freshCount = false;
     freshConnection();
     if (m_desk.left)
         return;
@@ -106,7 +107,8 @@ void UploadCheck::ListServerFiles() {
             m_desk.wording(QStringLiteral("מחוץ לתיקייה הרצוייה"), QStringLiteral("Outside the desired folder")));
         return;
     }
-    if (lookUp()) {
+    freshCount = lookUp();
+    if (freshCount) {
         count();
         tellCount(QStringLiteral("קבצים שהועלו בהצלחה"));
     }
@@ -169,7 +171,7 @@ void UploadCheck::ConfirmBrokenGone() {
             broken.removeAt(last);
     }
     if (broken.count() < m_board.List4BrokenB.count())
-        WriteBrokenFiles(m_desk.platform, m_desk.state.transfer.OrderFolder, broken);
+        m_session.keepBrokenFiles();
 }
 
 QStringList UploadCheck::missing() const {

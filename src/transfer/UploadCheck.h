@@ -31,6 +31,7 @@ public:
 
     // Names in List6 less those whose put failed: they are on the server, but not as sent files.
     std::int16_t NumOnServer = 0;
+    bool freshCount = false; // the last ListServerFiles saw the order's folder; else its count is that of older lists
 
 private:
     bool lookUp();

@@ -18,8 +18,8 @@ void UploadPass::run() {
     m_board.Frame9.visible = false;
     m_board.Image6.visible = false;
     m_session.beginPass();
-    StopFlag = false;
-    for (int i = 0; i < m_board.List3.count() && !StopFlag && !m_desk.left; ++i) {
+    m_desk.StopFlag = false;
+    for (int i = 0; i < m_board.List3.count() && !m_desk.StopFlag && !m_desk.left; ++i) {
         m_board.List3.setCurrentIndex(i);
         CurrentIndex = i;
         showProgress(i);
@@ -29,7 +29,7 @@ void UploadPass::run() {
     }
     if (m_desk.left)
         return;
-    if (StopFlag) {
+    if (m_desk.StopFlag) {
         tellStopped();
         return;
     }
@@ -40,6 +40,7 @@ void UploadPass::run() {
 void UploadPass::tellStopped() {
     m_session.closeSession();
     UserStopped = 1;
+    m_desk.StopFlag = false;
     m_board.pageSize = FtpBoard::PageSize::Full;
     m_board.Label4File.text.clear();
     Dialogs& dialogs = m_desk.platform.dialogs;
@@ -94,7 +95,7 @@ void UploadPass::UploadOneFile(const QString& path) {
     m_board.File1Enabled.enabled = false;
     m_board.Command12.visible = false;
     m_board.Label46.text = LeafName(m_desk.state.transfer.OrderFolder);
-    StopFlag = false;
+    m_desk.StopFlag = false;
     m_session.PauseBar(2);
     m_session.reconnect(captions());
     if (!m_session.FolderOk) {
@@ -112,7 +113,7 @@ void UploadPass::UploadOneFile(const QString& path) {
     m_board.pageSize = FtpBoard::PageSize::Small;
     if (m_desk.left)
         return;
-    if (StopFlag) {
+    if (m_desk.StopFlag) {
         m_session.FtpCloseConnection();
         return;
     }
@@ -153,19 +154,15 @@ void UploadPass::send(const QString& path) {
                     if (m_board.List4Broken.item(i) == path)
                         m_board.List4Broken.removeAt(i);
                 }
-                keepBrokenFiles();
+                m_session.keepBrokenFiles();
             }
         } else if (m_board.List4Broken.count() > BrokenBefore) {
-            keepBrokenFiles();
+            m_session.keepBrokenFiles();
         }
     }
     if (m_desk.wholeFiles())
         m_desk.status(m_desk.wording(QStringLiteral(" סיים להעלות קובץ"), QStringLiteral(" Finished uploading file ")) +
                       QString::number(CurrentIndex + 1));
-}
-
-void UploadPass::keepBrokenFiles() {
-    WriteBrokenFiles(m_desk.platform, m_desk.state.transfer.OrderFolder, m_board.List4Broken);
 }
 
 } // namespace lumora

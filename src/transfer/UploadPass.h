@@ -19,7 +19,6 @@ public:
     // The two boxes of a stop, and the page back at full size.
     void tellStopped();
 
-    bool StopFlag = false; // read at the head of each file and within it; reset where a file begins
     std::int16_t UserStopped = 0;
     int CurrentIndex = -1;     // index in List3
     int BrokenBefore = 0;      // size of List4Broken before a send
@@ -31,7 +30,6 @@ private:
     void showPiece(int index, const QString& name);
     void showFile(const QString& name);
     void send(const QString& path);
-    void keepBrokenFiles();
     void closeWithPauses();
     FtpSession::Captions captions() const;
 

@@ -259,6 +259,72 @@ TEST_F(FtpFrmTest, EndsAtOnceWhenTheProgramIsClosedInTheMiddle) {
     EXPECT_TRUE(rig.test.dialogs.messages.isEmpty());
 }
 
+// The window's own close knows nothing of the pass that runs below it.
+TEST_F(FtpFrmTest, EndsAtOnceWhenTheWindowIsClosedOrThePageUnloadedInTheMiddle) {
+    for (const bool closed : {true, false}) {
+        FakeLab line;
+        line.folders[QStringLiteral("zalamim234")];
+        FtpFrmRig order(line);
+        line.onPut = [&](const QString& name) {
+            if (name != FtpFrmRig::sheet())
+                return;
+            if (closed)
+                order.chain.endProgram();
+            else
+                order.chain.unload(PageId::FtpFrm);
+        };
+        order.send();
+        EXPECT_EQ(line.puts.size(), 2);
+        EXPECT_TRUE(line.urls.isEmpty());
+        EXPECT_TRUE(order.test.dialogs.messages.isEmpty());
+    }
+}
+
+// Nobody answers: a stop ends the tries, in a pass as in the check behind it.
+TEST_F(FtpFrmTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
+    for (const bool inCheck : {false, true}) {
+        FakeLab line;
+        line.folders[QStringLiteral("zalamim234")];
+        FtpFrmRig order(line);
+        line.deadConnects = FakeLab::always;
+        int stoppedAt = 0;
+        line.onConnect = [&](int number) {
+            const bool now = inCheck ? !order.page().Label4Do.text.startsWith(QStringLiteral("ההזמנה")) : number == 2;
+            if (stoppedAt == 0 && now) {
+                stoppedAt = number;
+                order.page().Command15_Click();
+            }
+        };
+        order.send();
+        FtpFrm& page = order.page();
+        EXPECT_GT(stoppedAt, 0);
+        EXPECT_EQ(line.connects, stoppedAt);
+        EXPECT_EQ(order.test.dialogs.messages.size(), 2);
+        EXPECT_TRUE(page.Label4Do.text.startsWith(QStringLiteral("השליחה נעצרה")));
+        // "Close", "do not close": what was stopped stays so.
+        page.Image3_Click();
+        page.Command14_Click();
+        EXPECT_FALSE(page.Timer1.running());
+        line.deadConnects = 0;
+        page.Command10_Click();
+        EXPECT_EQ(page.Label3.text, uploaded);
+    }
+}
+
+// The second half of a double press falls on the page that has just come up.
+TEST_F(FtpFrmTest, IgnoresAStartBeforeTheOrderIsListed) {
+    rig.test.pump.onPump = [&] {
+        if (auto* page = static_cast<FtpFrm*>(rig.chain.find(PageId::FtpFrm)); page && page->List4Makor.isEmpty()) {
+            page->Image5_Click();
+            page->Command10_Click();
+        }
+    };
+    rig.start();
+    EXPECT_TRUE(rig.page().Timer1.running());
+    EXPECT_TRUE(rig.test.dialogs.messages.isEmpty());
+    EXPECT_TRUE(lab.puts.isEmpty());
+}
+
 // More names on the server than the order has files: no verdict, and all is looked at four times.
 TEST_F(FtpFrmTest, GivesNoVerdictOnAFolderThatHoldsMore) {
     remote()[QStringLiteral("stranger.jpp")] = "x";
@@ -376,6 +442,7 @@ TEST_F(FtpFrmTest, ListsNothingWithoutAnOrder) {
 TEST_F(FtpFrmTest, ShowsTwoBoxesWhenNoServerIsNamed) {
     rig.state.profile.FtpPassword.clear();
     FtpFrm& page = rig.start();
+    EXPECT_TRUE(page.Command28.visible);
     EXPECT_EQ(rig.test.dialogs.messages.size(), 2);
     EXPECT_TRUE(rig.test.dialogs.messages.value(1).endsWith(QStringLiteral("  ש ל י ח ה    ח ו ז ר ת  ")));
     EXPECT_FALSE(page.Timer1.running());

@@ -171,14 +171,14 @@ TEST(BrokenFiles, ComeBackAsTheyWereWritten) {
     TextList broken;
     broken.append(QStringLiteral("C:\\תמונות\\a.jpp"));
     broken.append(QStringLiteral("C:\\b.jpp"));
-    WriteBrokenFiles(test.platform, QStringLiteral("C:"), broken);
+    ASSERT_TRUE(WriteBrokenFiles(test.files, QStringLiteral("C:"), broken));
     EXPECT_EQ(ReadBrokenFiles(test.files, QStringLiteral("C:\\")), broken.items());
     EXPECT_TRUE(IsBroken(broken, QStringLiteral("b.jpp")));
     EXPECT_FALSE(IsBroken(broken, QStringLiteral("B.jpp")));
     EXPECT_TRUE(ReadBrokenFiles(test.files, QStringLiteral("C:\\none")).isEmpty());
-    WriteBrokenFiles(test.platform, QStringLiteral("C:\\none"), broken);
-    ASSERT_EQ(test.dialogs.messages.size(), 1);
-    EXPECT_TRUE(test.dialogs.messages.first().contains(QStringLiteral("kashloo.txt")));
+    const auto written = WriteBrokenFiles(test.files, QStringLiteral("C:\\none"), broken);
+    ASSERT_FALSE(written);
+    EXPECT_TRUE(written.failure().message.contains(QStringLiteral("kashloo.txt")));
 }
 
 } // namespace lumora
