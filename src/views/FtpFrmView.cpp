@@ -14,6 +14,8 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -255,19 +257,34 @@ QWidget* FtpFrmView::firstFocus() const
     return m_sendNow;
 }
 
+// A button that hides hands the keyboard to its neighbour: the second half of a double press would stop what the first
+// half has started. While files travel nothing is chosen; in the end the main action is.
+void FtpFrmView::moveFocus(bool sending, QWidget* mainAction)
+{
+    if (frontOverlay(*window()) || std::exchange(m_wasSending, sending) == sending)
+        return;
+    if (sending)
+        setFocus(Qt::OtherFocusReason);
+    else
+        mainAction->setFocus(Qt::OtherFocusReason);
+}
+
 void FtpFrmView::render()
 {
     const bool done = m_page.AllDone == 1;
     const bool counting = m_page.Timer1.running();
     const bool failed = !done && !m_page.sending && (m_page.Picture6.visible || m_page.Command10.visible);
+    const bool nothing = !done && !failed && !m_page.sending && m_page.Command28.visible;
+    window()->setWindowTitle(m_page.caption.trimmed().isEmpty() ? u"Lumora"_s : m_page.caption.simplified());
     frame().steps().setStep(done ? OrderStep::Done : OrderStep::Sending);
     frame().setTitle(done       ? wording(u"ההזמנה נשלחה"_s, u"Your order was sent"_s)
                      : failed   ? wording(u"השליחה לא הושלמה"_s, u"The sending is not complete"_s)
+                     : nothing  ? wording(u"אין מה לשלוח"_s, u"Nothing can be sent"_s)
                      : counting ? wording(u"ההזמנה מוכנה לשליחה"_s, u"Your order is ready to be sent"_s)
                                 : wording(u"שליחת ההזמנה"_s, u"Sending your order"_s));
     if (done)
         m_gauge->showSign(Gauge::Mood::Good);
-    else if (failed)
+    else if (failed || nothing)
         m_gauge->showSign(Gauge::Mood::Bad);
     else if (m_page.sending)
         m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
@@ -316,11 +333,12 @@ void FtpFrmView::render()
     // One main action at a time; the others that the page allows stand beside it or wait.
     m_sendNow->setVisible(m_page.Image5.visible && !failed && !done && !m_page.sending);
     m_sendAgain->setVisible(m_page.Command10.visible && failed);
-    setRole(m_newOrder, done ? "main" : "secondary");
+    setRole(m_newOrder, done || nothing ? "main" : "secondary");
     m_newOrder->setStyleSheet(m_newOrder->styleSheet());
     m_newOrder->setVisible(m_page.Command28.visible);
     m_stop->setVisible(m_page.Command15.visible && m_page.sending);
-    m_count->setVisible(m_page.Command23.visible && !m_page.sending && !failed && !done);
+    m_count->setVisible(m_page.Command23.visible && !m_page.sending && !failed && !done && !nothing);
+    moveFocus(m_page.sending, m_sendAgain->isVisibleTo(this) ? m_sendAgain : m_newOrder);
     setIcon(m_count, counting ? u"pause"_s : u"play"_s, Theme::Colour::Ink);
     m_exit->setVisible(done && m_page.Command11.visible);
     for (const auto& [label, texts] : m_listTitles)

@@ -25,8 +25,10 @@ private:
     void makeBars();
     void makePanels();
     void bindTheRest();
+    void moveFocus(bool sending, QWidget* mainAction);
 
     FtpFrm& m_page;
+    bool m_wasSending = false;
     const Files& m_files;
     Gauge* m_gauge = nullptr;
     QFrame* m_failure = nullptr;

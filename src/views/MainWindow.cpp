@@ -80,6 +80,7 @@ void MainWindow::pageShown(Page* page)
 void MainWindow::bringToFront(PageView* view)
 {
     m_front = view;
+    setWindowTitle(QStringLiteral("Lumora")); // a page with a title of its own sets it as it renders
     m_stack->setCurrentWidget(view);
     setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     view->renderNow();
