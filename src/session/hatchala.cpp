@@ -276,7 +276,7 @@ void hatchala::Timer5_Tick() {
     if (Label8Top >= arrowBottom)
         Label8Top = arrowTop;
     ++Label8Top;
-    Q_EMIT changed();
+    // Not told: the page may wait for hours, and a rendering for each of these ticks would keep the machine busy.
 }
 
 // --- the profile and its service panel ---

@@ -86,7 +86,7 @@ public:
     Caption Label6;        // the countdown's number
     Caption Label7;        // the countdown's text
     Caption Label8;        // the arrow that moves above the start button
-    int Label8Top = 400;   // 400 to 430
+    int Label8Top = 400;   // 400 to 430; moves without a changed()
     Caption Picture1;      // the panel with List1
     int Picture1Width = 0; // grows to 230
     Caption List1Caption;  // what is asked

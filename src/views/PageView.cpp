@@ -287,7 +287,11 @@ void PageView::bindList(const QString& name, const TextList& list, QWidget* widg
 void PageView::setDirectedIcon(QPushButton* button, bool forwards)
 {
     const bool right = forwards != (layoutDirection() == Qt::RightToLeft);
-    setIcon(button, right ? u"arrow-right"_s : u"arrow-left"_s,
+    const QString icon = right ? u"arrow-right"_s : u"arrow-left"_s;
+    if (button->property("directedIcon") == icon)
+        return; // a button that is given its icon again paints itself again
+    button->setProperty("directedIcon", icon);
+    setIcon(button, icon,
             button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
 }
 

@@ -170,9 +170,17 @@ TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
     EXPECT_EQ(page.Picture4Width, 4);
     page.Timer2_Tick();
     EXPECT_EQ(page.Picture4Width, 5);
+}
+
+TEST_F(hatchalaTest, ThePageThatWaitsAsksForNoRendering) {
+    hatchala& page = start();
+    int renderings = 0;
+    QObject::connect(&page, &Page::changed, [&] { ++renderings; });
+    page.Timer2_Tick();
     page.Label8Top = 430;
     page.Timer5_Tick();
     EXPECT_EQ(page.Label8Top, 401);
+    EXPECT_EQ(renderings, 0);
 }
 
 TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
