@@ -29,7 +29,7 @@ namespace lumora {
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder)
         : deployment(std::move(read))
-        , drives(dataFolder, deployment.programLetter)
+        , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
         , volume(drives)
         , shell(drives)
@@ -83,13 +83,15 @@ Result<void> Program::start()
     else if (!reading.deployment.dataFolder.isEmpty())
         dataFolder = toHostPath(reading.deployment.dataFolder);
     std::error_code error;
-    std::filesystem::create_directories(dataFolder, error);
+    const bool made = std::filesystem::create_directories(dataFolder, error);
     if (error) {
         return Failure{Failure::Kind::AccessDenied,
                        QStringLiteral("%1: the data folder can't be made: %2")
                            .arg(toText(dataFolder), QString::fromStdString(error.message()))};
     }
-    std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
+    // A folder that stood there already may serve others too, and keeps its rights; what is made in it is closed.
+    if (made)
+        std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
 
     m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder);
     Parts& parts = *m_parts;

@@ -54,10 +54,11 @@ std::pair<dev_t, ino_t> identity(const HostPath& folder) {
 
 } // namespace
 
-Drives::Drives(HostPath dataFolder, QChar programLetter, std::vector<HostPath> mediaRoots)
+Drives::Drives(HostPath dataFolder, QChar programLetter, std::vector<HostPath> mediaRoots, QString offeredFirst)
     : m_dataFolder(normal(dataFolder))
     , m_programLetter(programLetter.toUpper())
-    , m_mediaRoots(std::move(mediaRoots)) {
+    , m_mediaRoots(std::move(mediaRoots))
+    , m_offeredFirst(std::move(offeredFirst)) {
     for (HostPath& root : m_mediaRoots)
         root = normal(root);
     refreshMedia();
@@ -132,13 +133,21 @@ void Drives::refreshMedia() {
 }
 
 std::vector<Drives::Drive> Drives::drives() const {
-    std::vector<Drive> all = {{m_programLetter, m_dataFolder, toText(m_dataFolder.filename()), false}};
+    std::vector<Drive> all;
+    const auto add = [&](QChar letter, const HostPath& folder, const QString& name, bool removable) {
+        all.push_back({letter, folder, name, removable, m_offeredFirst.contains(letter)});
+    };
+    add(m_programLetter, m_dataFolder, toText(m_dataFolder.filename()), false);
     for (const auto& [letter, folder] : m_media) {
         if (holdsMedium(folder))
-            all.push_back({letter, folder, toText(folder.filename()), true});
+            add(letter, folder, toText(folder.filename()), true);
     }
     if (m_programLetter != rootLetter)
-        all.push_back({rootLetter, "/", QStringLiteral("/"), false});
+        add(rootLetter, "/", QStringLiteral("/"), false);
+    const auto place = [&](const Drive& drive) {
+        return drive.offeredFirst ? m_offeredFirst.indexOf(drive.letter) : m_offeredFirst.size();
+    };
+    std::stable_sort(all.begin(), all.end(), [&](const Drive& a, const Drive& b) { return place(a) < place(b); });
     return all;
 }
 

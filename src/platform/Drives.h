@@ -19,7 +19,9 @@ class Drives {
 public:
     // mediaRoots: folders whose sub-folders are mounted media, as /media/<user>/CARD and /run/media/<user>/CARD. A
     // medium that appears twice takes one letter; a medium keeps its letter, also when it is taken out meanwhile.
-    Drives(HostPath dataFolder, QChar programLetter = u'C', std::vector<HostPath> mediaRoots = defaultMediaRoots());
+    // offeredFirst: letters of the drives that drives() puts in front, in this order.
+    Drives(HostPath dataFolder, QChar programLetter = u'C', std::vector<HostPath> mediaRoots = defaultMediaRoots(),
+           QString offeredFirst = {});
 
     static std::vector<HostPath> defaultMediaRoots();
     // $XDG_DATA_HOME/lumora/drive_c, or ~/.local/share/lumora/drive_c.
@@ -38,6 +40,7 @@ public:
         HostPath folder;
         QString name; // what a person calls it: the medium's label, or the folder's name
         bool removable;
+        bool offeredFirst;
     };
     std::vector<Drive> drives() const;
 
@@ -53,6 +56,7 @@ private:
     HostPath m_dataFolder;
     QChar m_programLetter;
     std::vector<HostPath> m_mediaRoots;
+    QString m_offeredFirst;
     std::map<QChar, HostPath> m_media;
 };
 

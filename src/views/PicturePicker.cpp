@@ -259,10 +259,14 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
         if (!folder.empty() && !known && std::filesystem::is_directory(folder, error))
             result.push_back({name, icon, folder});
     };
+    const auto addDrive = [&](const Drives::Drive& drive) {
+        const QString name = drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : drive.name;
+        add(name, drive.removable ? u"card"_s : u"drive"_s, drive.folder);
+    };
     const auto drives = m_files.drives().drives();
     for (const Drives::Drive& drive : drives) {
-        if (drive.removable)
-            add(drive.name, u"card"_s, drive.folder);
+        if (drive.removable || drive.offeredFirst)
+            addDrive(drive);
     }
     const auto standard = [](QStandardPaths::StandardLocation where) {
         return toHostPath(QStandardPaths::writableLocation(where));
@@ -274,7 +278,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
     if (const auto initial = m_files.drives().toHost(initialFolder))
         add(initialFolder.left(2), u"drive"_s, *initial);
     for (const Drives::Drive& drive : drives)
-        add(drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : drive.name, u"drive"_s, drive.folder);
+        addDrive(drive);
     if (result.empty())
         result.push_back({u"/"_s, u"drive"_s, "/"});
     return result;

@@ -82,6 +82,17 @@ TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
     EXPECT_EQ(drives.toDrive(media / "ONE"), QStringLiteral("D:\\"));
 }
 
+TEST_F(DrivesTest, OffersTheDrivesThatTheLabPutsFirstBeforeTheOthers) {
+    insertCard("ONE");
+    insertCard("TWO");
+    const Drives drives(data, u'C', {media}, QStringLiteral("ZXE"));
+    QString letters;
+    for (const Drives::Drive& drive : drives.drives())
+        letters += drive.letter;
+    EXPECT_EQ(letters, u"ZECD");
+    EXPECT_EQ(drives.toDrive(media / "TWO" / "a.jpg"), QStringLiteral("E:\\a.jpg"));
+}
+
 TEST_F(DrivesTest, CountsAMediumThatShowsTwiceOnce) {
     insertCard("CARD");
     const HostPath second = base / "run";
