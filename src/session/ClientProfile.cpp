@@ -46,6 +46,9 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.coupon.HaKoopon = deployment.HaKoopon;
+    // With a limit of nothing a lab that takes coupons would get no order at all.
+    state.coupon.SmallCount = deployment.HaKoopon == 1 ? 220 : 0;
+    state.coupon.LargeCount = deployment.HaKoopon == 1 ? 3 : 0;
 }
 
 } // namespace lumora

@@ -346,6 +346,10 @@ TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
     EXPECT_EQ(page.Label4kpn.text, u"350");
     page.Combo1_Click(4);
     EXPECT_EQ(state.coupon.MisparKoopon, 350) << "the list of all sizes sets no limit";
+    chain.unload(PageId::nnn);
+    deployment.HaKoopon = 1;
+    start().Option1_Click(0);
+    EXPECT_EQ(state.coupon.MisparKoopon, 220) << "a lab that takes coupons sells this one unless it says otherwise";
 }
 
 TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
