@@ -8,8 +8,8 @@ namespace {
 
 struct ClientTiles {
     const char* letter;
-    std::vector<Tile> hidden;
-    std::vector<Tile> shown;
+    std::vector<TileIndex> hidden;
+    std::vector<TileIndex> shown;
 };
 
 } // namespace
@@ -29,9 +29,9 @@ std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunat
     for (const ClientTiles& client : clients) {
         if (clientLetter != QLatin1String(client.letter))
             continue;
-        for (const Tile tile : client.hidden)
+        for (const TileIndex tile : client.hidden)
             visible[tile] = false;
-        for (const Tile tile : client.shown)
+        for (const TileIndex tile : client.shown)
             visible[tile] = true;
     }
     if (tmunatPaar == 1)

@@ -7,7 +7,7 @@
 namespace lumora {
 
 // The menu's tiles by their index.
-enum Tile {
+enum TileIndex {
     PrintTile,    // prints, with the details page
     QuickTile,    // prints through the editor
     SequenceTile, // prints picked in one sequence

@@ -153,7 +153,6 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
 
     // The question at which shop the prints are fetched.
     m_shops = new Overlay(theme, this);
-    m_shops->setAccessibleName(u"List1"_s);
     m_ask = makeLabel(m_shops, "title");
     m_shops->column()->addWidget(m_ask);
     auto* list = new QListWidget(m_shops);
@@ -163,6 +162,7 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     bindList(u"List1"_s, page.List1, list);
     m_shops->column()->addWidget(list);
     m_shops->setFirstFocus(list);
+    m_shopList = list;
     bind(u"Picture1"_s, new QWidget(m_shops), page.Picture1);
 
     m_hovers = {{m_start, hatchala::Hover::Image1}, {prices, hatchala::Hover::Image11}, {site, hatchala::Hover::Image5},
@@ -223,6 +223,8 @@ void hatchalaView::render()
     const QString question = m_page.List1Caption.text.trimmed();
     m_ask->setText(!question.isEmpty() ? question
                                        : wording(u"היכן תרצה לקבל את התמונות?"_s, u"Where do you want to receive the pictures?"_s));
+    speak(m_shops, m_ask->text());
+    speak(m_shopList, m_ask->text());
     m_shops->setOpen(m_page.Picture1.visible);
 }
 

@@ -20,8 +20,6 @@ protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
-    void hover(QWidget* widget, hatchala::Hover over);
-
     hatchala& m_page;
     const Files& m_files;
     QPushButton* m_start;
@@ -34,6 +32,7 @@ private:
     QWidget* m_telephone;
     QWidget* m_mail;
     Overlay* m_shops;
+    QWidget* m_shopList;
     PictureBox* m_advert;
     QString m_advertFile;
     std::vector<std::pair<QWidget*, hatchala::Hover>> m_hovers;

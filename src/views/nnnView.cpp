@@ -1,5 +1,6 @@
 #include "views/nnnView.h"
 
+#include "entry/TileMenu.h"
 #include "views/Cards.h"
 #include "views/Overlay.h"
 
@@ -13,17 +14,11 @@
 #include <QStackedLayout>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-// The tiles that stand in the header instead of the menu: leaving and the language.
-constexpr int exitTile = 5;
-constexpr int englishTile = 8;
-
-} // namespace
 
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
@@ -60,8 +55,8 @@ QWidget* nnnView::makeMenu()
     static constexpr std::array<const char*, 10> icons = {"printer", "bolt", "layers", "arrow-left", "mail",
                                                           "exit",    "book", "resend", "globe",      "info"};
     for (int i = 0; i < 10; ++i) {
-        if (i == exitTile || i == englishTile)
-            continue;
+        if (i == ExitTile || i == EnglishTile)
+            continue; // leaving and the language stand in the header
         auto* tile = new Tile(theme(), this, QString::fromLatin1(icons[static_cast<std::size_t>(i)]));
         connect(tile, &QAbstractButton::clicked, this, [this, i] { m_page.Image1_Click(i); });
         bind(u"Image1(%1)"_s.arg(i), tile, m_page.Image1[static_cast<std::size_t>(i)]);
@@ -178,10 +173,9 @@ QWidget* nnnView::makeBorders()
     row->setSpacing(theme().px(24));
     auto* grid = new QGridLayout;
     grid->setSpacing(theme().px(12));
-    static constexpr std::array<const char*, 10> codes = {"NB", "B7", "BB1", "BB2", "CA1", "BB", "CA9", "BL1", "FA9", "WB"};
     for (int i = 0; i < 10; ++i) {
         const auto at = static_cast<std::size_t>(i);
-        auto* card = new BorderCard(theme(), this, QString::fromLatin1(codes[at]));
+        auto* card = new BorderCard(theme(), this, borderCode(i));
         bindChoice(u"Image13(%1)"_s.arg(i), card, m_page.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
         grid->addWidget(card, i / 4, i % 4);
     }
@@ -269,9 +263,9 @@ QWidget* nnnView::makeTerms()
 void nnnView::makeBars()
 {
     frame().addHeaderAction(
-        button(u"Image1(8)"_s, m_page.Image1[englishTile], Role::Quiet, [this] { m_page.Image1_Click(englishTile); }, u"globe"_s));
+        button(u"Image1(8)"_s, m_page.Image1[EnglishTile], Role::Quiet, [this] { m_page.Image1_Click(EnglishTile); }, u"globe"_s));
     frame().addHeaderAction(
-        button(u"Image1(5)"_s, m_page.Image1[exitTile], Role::Quiet, [this] { m_page.Image1_Click(exitTile); }, u"exit"_s));
+        button(u"Image1(5)"_s, m_page.Image1[ExitTile], Role::Quiet, [this] { m_page.Image1_Click(ExitTile); }, u"exit"_s));
 
     m_back = button(u"Command4"_s, m_page.Command4, Role::Secondary, [this] { m_page.Command4_Click(); });
     frame().addSecondaryAction(m_back);
@@ -353,8 +347,7 @@ void nnnView::render()
         m_address->setStyleSheet(m_address->styleSheet()); // the look follows the property only when it is set anew
     }
     const int border = m_page.Picture16;
-    static constexpr std::array<const char*, 10> codes = {"NB", "B7", "BB1", "BB2", "CA1", "BB", "CA9", "BL1", "FA9", "WB"};
-    m_sample->setCode(border >= 0 && border < 10 ? QString::fromLatin1(codes[static_cast<std::size_t>(border)]) : u"NB"_s);
+    m_sample->setCode(borderCode(std::max(border, 0)));
     m_sampleName->setText(border >= 0 && border < 10 ? m_page.Image13[static_cast<std::size_t>(border)].text
                                                      : wording(u"עדיין לא נבחרה מסגרת"_s, u"No border chosen yet"_s));
     speak(m_sample, m_sampleName->text());
