@@ -6,7 +6,7 @@
 // path into a path of this machine.
 namespace lumora {
 
-// The answer of the path helpers for "nothing", and the text of a field that was not chosen yet.
+// What the functions below answer for "nothing", and the text of a field that was not chosen yet.
 inline const QString notChosen = QStringLiteral("***");
 
 // The text behind the last backslash; "***" when there is none.

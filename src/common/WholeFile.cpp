@@ -31,16 +31,30 @@ int writeAll(int file, const QByteArray& bytes) {
 
 } // namespace
 
+Failure::Kind failureKind(int errorNumber) {
+    switch (errorNumber) {
+    case ENOENT:
+    case ENOTDIR:
+        return Failure::Kind::NotFound;
+    case EACCES:
+    case EPERM:
+    case EROFS:
+        return Failure::Kind::AccessDenied;
+    case ENOSPC:
+    case EDQUOT:
+        return Failure::Kind::NoSpace;
+    case EFBIG:
+        return Failure::Kind::TooLarge;
+    default:
+        return Failure::Kind::Other;
+    }
+}
+
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int errorNumber) {
-    const auto kind = errorNumber == ENOENT || errorNumber == ENOTDIR ? Failure::Kind::NotFound
-                      : errorNumber == EACCES || errorNumber == EPERM || errorNumber == EROFS
-                          ? Failure::Kind::AccessDenied
-                      : errorNumber == ENOSPC || errorNumber == EDQUOT ? Failure::Kind::NoSpace
-                                                                       : Failure::Kind::Other;
     const std::string name = path.string();
-    return {kind, QStringLiteral("%1: %2: %3")
-                      .arg(QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())), what,
-                           QString::fromLocal8Bit(std::strerror(errorNumber)))};
+    return {failureKind(errorNumber), QStringLiteral("%1: %2: %3")
+                                          .arg(QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())),
+                                               what, QString::fromLocal8Bit(std::strerror(errorNumber)))};
 }
 
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes) {

@@ -12,7 +12,10 @@ namespace lumora {
 // one and never half a file. The failure's message names the path and the reason.
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes);
 
-// "PATH: what happened: reason of the error number", with the kind that the number stands for.
+// The kind that an error number of the system stands for.
+Failure::Kind failureKind(int errorNumber);
+
+// "PATH: what happened: reason of the error number".
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int errorNumber);
 
 } // namespace lumora

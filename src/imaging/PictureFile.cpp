@@ -95,9 +95,9 @@ std::vector<Result<Bitmap>> loadSmallPictures(const std::vector<std::filesystem:
     };
     {
         const std::size_t cores = std::max(1U, std::thread::hardware_concurrency());
-        std::vector<std::jthread> helpers;
+        std::vector<std::jthread> others;
         for (std::size_t i = 1; i < std::min(cores, paths.size()); ++i)
-            helpers.emplace_back(work);
+            others.emplace_back(work);
         work();
     }
     std::vector<Result<Bitmap>> results;

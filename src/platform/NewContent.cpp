@@ -1,5 +1,7 @@
 #include "platform/NewContent.h"
 
+#include "common/WholeFile.h"
+
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -12,28 +14,7 @@
 namespace lumora {
 
 Failure systemFailure(int error, const QString& path) {
-    auto kind = Failure::Kind::Other;
-    switch (error) {
-    case ENOENT:
-    case ENOTDIR:
-        kind = Failure::Kind::NotFound;
-        break;
-    case EACCES:
-    case EPERM:
-    case EROFS:
-        kind = Failure::Kind::AccessDenied;
-        break;
-    case ENOSPC:
-    case EDQUOT:
-        kind = Failure::Kind::NoSpace;
-        break;
-    case EFBIG:
-        kind = Failure::Kind::TooLarge;
-        break;
-    default:
-        break;
-    }
-    return {kind, QStringLiteral("%1: %2").arg(path, QString::fromLocal8Bit(std::strerror(error)))};
+    return {failureKind(error), QStringLiteral("%1: %2").arg(path, QString::fromLocal8Bit(std::strerror(error)))};
 }
 
 Descriptor::Descriptor(Descriptor&& other) noexcept

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "session/Caption.h"
 #include "session/Page.h"
 
 namespace lumora {
