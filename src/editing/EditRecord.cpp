@@ -54,4 +54,82 @@ void UnpackEditState(const QString& record, EditFields& fields) {
     fields.TextBody = text(R::TextBody).trimmed();
 }
 
+void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder) {
+    namespace R = EditRecord;
+    const bool white = paperBorderCode == QStringLiteral("WB");
+    const bool black = paperBorderCode == QStringLiteral("BK");
+    if ((white || black) && fields.FrameName == QStringLiteral("000")) {
+        fields.FrameName = white ? QStringLiteral("001") : QStringLiteral("002");
+        if (fields.FrameFolder.isEmpty())
+            fields.FrameFolder = frameFolder;
+    }
+
+    const QString before = LeftField(fields.EditState, R::width);
+    QString record(R::width, u' ');
+    const auto text = [&](R::Column column, const QString& value) {
+        record.replace(column.position - 1, column.width, LeftField(value, column.width));
+    };
+    const auto number = [&](R::Column column, int value) { text(column, QString::number(value)); };
+    // No page sets these; what came with the record goes on with it.
+    const auto carried = [&](R::Column column) {
+        number(column, Val16(before.mid(column.position - 1, column.width)));
+    };
+
+    text(R::GainR, PlainNumber(fields.GainR));
+    text(R::GainG, PlainNumber(fields.GainG));
+    text(R::GainB, PlainNumber(fields.GainB));
+    number(R::RotationCode, fields.RotationCode);
+    number(R::ZoomPercent, fields.ZoomPercent);
+    number(R::PanX, fields.PanX);
+    number(R::PanY, fields.PanY);
+    number(R::ToneFlag, fields.ToneFlag);
+    number(R::SpareFlag, fields.SpareFlag);
+    text(R::FrameName, fields.FrameName);
+    text(R::LineFrameCode, fields.LineFrameCode);
+    text(R::RedMarker, fields.RedMarker);
+    text(R::AutoMarker, fields.AutoMarker);
+    text(R::FrameFolder, fields.FrameFolder);
+    number(R::TextFontSize, fields.TextFontSize);
+    number(R::TextAlign, fields.TextAlign);
+    carried(R::Spare59);
+    carried(R::Spare61);
+    number(R::TextOn, fields.TextOn);
+    text(R::Tag, QStringLiteral("ddd"));
+    number(R::TextBlue, fields.TextBlue);
+    number(R::TextGreen, fields.TextGreen);
+    number(R::TextRed, fields.TextRed);
+    number(R::TextX, fields.TextX);
+    number(R::TextY, fields.TextY);
+    carried(R::Spare90);
+    number(R::TextVertical, fields.TextVertical);
+    number(R::TextStyle, fields.TextStyle);
+    text(R::TextFont, fields.TextFont);
+    text(R::TextBody, fields.TextBody);
+    fields.EditState = record;
+}
+
+namespace EditStep {
+
+float gain(float from, int hundredths) {
+    return static_cast<float>(static_cast<double>(from) + hundredths / 100.0);
+}
+
+std::int16_t zoom(std::int16_t from, int step) {
+    return static_cast<std::int16_t>(std::clamp(from + step, 40, 210));
+}
+
+std::int16_t turn(std::int16_t from, int step) {
+    return from + step > 540 ? std::int16_t{180} : HoldIn16Bits(from + step);
+}
+
+std::int16_t quarterRight(std::int16_t from) {
+    return HoldIn16Bits(from + 90 > 540 ? from - 270 : from + 90);
+}
+
+std::int16_t quarterLeft(std::int16_t from) {
+    return HoldIn16Bits(from - 90 < 180 ? from + 270 : from - 90);
+}
+
+} // namespace EditStep
+
 } // namespace lumora

@@ -2,7 +2,7 @@
 
 #include <QString>
 
-#include <array>
+#include <cstdint>
 
 namespace lumora {
 
@@ -36,6 +36,8 @@ inline constexpr Column AutoMarker{42, 3};
 inline constexpr Column FrameFolder{45, 10};
 inline constexpr Column TextFontSize{55, 2};
 inline constexpr Column TextAlign{57, 2};
+inline constexpr Column Spare59{59, 2};
+inline constexpr Column Spare61{61, 2};
 inline constexpr Column TextOn{63, 2};
 inline constexpr Column Tag{65, 10};
 inline constexpr Column TextBlue{75, 3};
@@ -43,6 +45,7 @@ inline constexpr Column TextGreen{78, 3};
 inline constexpr Column TextRed{81, 3};
 inline constexpr Column TextX{84, 3};
 inline constexpr Column TextY{87, 3};
+inline constexpr Column Spare90{90, 3};
 inline constexpr Column TextVertical{93, 2};
 inline constexpr Column TextStyle{95, 2};
 inline constexpr Column TextFont{97, 30};
@@ -59,5 +62,27 @@ QString beforeAnyPicture();
 // Splits a record into the fields of a picture; PicturePath and TempRedName stay. Numbers stop at the first character
 // that is no part of one, so that blanks, "000" and "0  " all read as 0; a font size below 8 becomes 8.
 void UnpackEditState(const QString& record, EditFields& fields);
+
+// Writes the fields into EditState. The border "WB" or "BK" of the order becomes frame "001" or "002" of a picture that
+// has none ("000"; one whose frame was removed, "999", stays without), and takes frameFolder where the record names
+// no folder. A field that is too long loses its right end without a word: a gain keeps its first four characters.
+void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder);
+
+// The steps of the editor's buttons. What leaves 16 bits is held at the limit.
+namespace EditStep {
+
+// A gain and so many hundredths, in double precision, kept as a single.
+float gain(float from, int hundredths);
+
+// Held within 40 to 210.
+std::int16_t zoom(std::int16_t from, int step);
+
+// Over 540 the turn starts again at 180; downwards there is no limit. The quarter turns have their own range, and the
+// two do not agree.
+std::int16_t turn(std::int16_t from, int step);
+std::int16_t quarterRight(std::int16_t from);
+std::int16_t quarterLeft(std::int16_t from);
+
+} // namespace EditStep
 
 } // namespace lumora

@@ -25,9 +25,14 @@ void drawTurned(Bitmap& target, const QRect& box, const Bitmap& picture, Quarter
         QPainter(&target.image()).drawImage(box.topLeft(), scaled.image());
 }
 
+QString installedFamily(const QString& family) {
+    const QString known = family == QStringLiteral("David") ? QStringLiteral("David CLM") : family;
+    return QFontDatabase::hasFamily(known) ? known : QString();
+}
+
 void drawText(Bitmap& target, const QPoint& topLeft, const QString& text, const TextStyle& style) {
-    const QString family = style.family == QStringLiteral("David") ? QStringLiteral("David CLM") : style.family;
-    if (target.isNull() || !QFontDatabase::hasFamily(family))
+    const QString family = installedFamily(style.family);
+    if (target.isNull() || family.isEmpty())
         return;
     QFont font(family);
     font.setPixelSize(style.pixelSize);

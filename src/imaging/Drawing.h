@@ -17,8 +17,11 @@ Bitmap turned(const Bitmap& picture, QuarterTurn turn);
 // The picture turned and then scaled smoothly to fill the box exactly; what lies outside the target is clipped.
 void drawTurned(Bitmap& target, const QRect& box, const Bitmap& picture, QuarterTurn turn);
 
+// The family to draw with: "David" stands for "David CLM". Empty when this machine lacks it.
+QString installedFamily(const QString& family);
+
 struct TextStyle {
-    QString family; // "David" is "David CLM"; a family that this machine lacks draws nothing
+    QString family; // a family that this machine lacks draws nothing
     int pixelSize = 16;
     QColor colour = Qt::black;
     bool bold = false;

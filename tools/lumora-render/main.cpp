@@ -2,9 +2,14 @@
 
 #include "assembly/PaperResize.h"
 #include "common/WholeFile.h"
+#include "editing/EditRecord.h"
+#include "editing/EditedPicture.h"
 #include "imaging/PictureFile.h"
+#include "session/SessionState.h"
 
 #include <QBuffer>
+#include <QColor>
+#include <QGuiApplication>
 
 #include <charconv>
 #include <chrono>
@@ -29,9 +34,14 @@ constexpr std::string_view help =
 Modes:
   plain   the picture scaled to the paper as an order without edits prints it (needs --paper)
   small   the small picture of a cell, as PNG
+  preview what the editor shows of an edited picture, as PNG (needs --paper)
+  print   the print of an edited picture (needs --paper)
 
 Options:
   --paper 10/15   the paper, short side and long side in centimetres
+  --record TEXT   the edit record for preview and print; blanks follow (default: a picture that was not edited)
+  --frames FOLDER the folder that holds the categories of frames (default: no frames)
+  --background RRGGBB  what an uncovered part of the paper shows (default: the whole picture, stretched)
   --size 115      pixels of the cell for the mode small (default 115)
   --png           the pixels before JPEG, as PNG
   --out FOLDER    where results go (default: the current folder); they keep the base name
@@ -42,13 +52,20 @@ Exit status: 0 all pictures done, 1 a picture failed (the others are done all th
 )";
 
 struct Request {
-    enum class Mode { Plain, Small } mode = Mode::Plain;
+    enum class Mode { Plain, Small, Preview, Print } mode = Mode::Plain;
     std::optional<PaperSize> paper;
+    EditFields edit;
+    fs::path frames;
+    std::optional<QColor> background;
     int cell = 115;
     bool png = false;
     bool time = false;
     fs::path out = ".";
     std::vector<fs::path> files;
+
+    PaperDigits digits() const { return {paper->shortSide, paper->longSide}; }
+    bool isEdited() const { return mode == Mode::Preview || mode == Mode::Print; }
+    bool writesPng() const { return png || mode == Mode::Small || mode == Mode::Preview; }
 };
 
 void complain(std::string_view text) {
@@ -63,6 +80,7 @@ void complain(const QString& text) {
 std::optional<Request> understood(const std::vector<std::string>& arguments) {
     Request request;
     std::string modeName;
+    UnpackEditState(EditRecord::newPicture(), request.edit);
     const auto refuse = [](const std::string& reason) {
         complain(reason + "; --help tells more");
         return std::nullopt;
@@ -82,7 +100,8 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
         std::optional<std::string> value;
         if (equals != std::string::npos)
             value = argument.substr(equals + 1);
-        const bool takesValue = name == "--paper" || name == "--size" || name == "--out";
+        const bool takesValue = name == "--paper" || name == "--size" || name == "--out" || name == "--record" ||
+                                name == "--frames" || name == "--background";
         if (takesValue && !value && i + 1 < arguments.size())
             value = arguments[++i];
         if (takesValue != value.has_value() && (takesValue || value))
@@ -96,6 +115,18 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
             request.time = true;
         } else if (name == "--out") {
             request.out = *value;
+        } else if (name == "--record") {
+            UnpackEditState(QString::fromUtf8(value->c_str()), request.edit);
+        } else if (name == "--frames") {
+            std::error_code ignored;
+            if (!fs::is_directory(*value, ignored))
+                return refuse("--frames " + *value + " is no folder");
+            request.frames = *value;
+        } else if (name == "--background") {
+            const QColor colour(u'#' + QString::fromUtf8(value->c_str()));
+            if (value->size() != 6 || !colour.isValid())
+                return refuse("--background " + *value + " is no colour; six hexadecimal digits are wanted, as FF8000");
+            request.background = colour;
         } else if (name == "--paper") {
             request.paper = PaperSize::parse(QString::fromUtf8(value->c_str()));
             if (!request.paper)
@@ -109,15 +140,16 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
             return refuse("unknown option " + name);
         }
     }
-    if (modeName == "plain")
-        request.mode = Request::Mode::Plain;
-    else if (modeName == "small")
-        request.mode = Request::Mode::Small;
-    else
-        return refuse(modeName.empty() ? "no mode is given; plain or small"
-                                       : "unknown mode " + modeName + "; plain or small");
-    if (request.mode == Request::Mode::Plain && !request.paper)
-        return refuse("the mode plain needs --paper");
+    using Mode = Request::Mode;
+    const std::map<std::string, Mode> modes{
+        {"plain", Mode::Plain}, {"small", Mode::Small}, {"preview", Mode::Preview}, {"print", Mode::Print}};
+    const auto mode = modes.find(modeName);
+    if (mode == modes.end())
+        return refuse((modeName.empty() ? "no mode is given" : "unknown mode " + modeName) +
+                      "; plain, small, preview or print");
+    request.mode = mode->second;
+    if (request.mode != Mode::Small && !request.paper)
+        return refuse("the mode " + modeName + " needs --paper");
     if (request.files.empty())
         return refuse("no file is given");
     return request;
@@ -159,25 +191,66 @@ Result<QByteArray> pngOf(const Bitmap& picture, const fs::path& source) {
     return bytes;
 }
 
-Result<void> render(const Request& request, const fs::path& source, const fs::path& target, PictureTimes& times) {
+Result<QByteArray> previewPng(const Request& request, const fs::path& source, PictureTimes& times) {
+    EditFields edit = request.edit;
+    auto start = std::chrono::steady_clock::now();
+    auto preview = EditedPreview::open(source, request.digits(), edit.ZoomPercent,
+                                       edit.ToneFlag == 1 ? EditedPreview::Tone::Grey : EditedPreview::Tone::Colour);
+    times.decode = millisecondsSince(start);
+    if (!preview)
+        return preview.failure();
+    if (request.background)
+        preview->setBackground(*request.background);
+    preview->placeAtCentreIfUnset(edit);
+    start = std::chrono::steady_clock::now();
+    const Bitmap shown = preview->render(edit, loadFrame(request.frames, edit, FrameUse::Preview));
+    times.draw = millisecondsSince(start);
+    start = std::chrono::steady_clock::now();
+    auto bytes = pngOf(shown, source);
+    times.encode = millisecondsSince(start);
+    return bytes;
+}
+
+Result<QByteArray> editedPrint(const Request& request, const fs::path& source, PictureTimes& times) {
+    EditedPrint print;
+    print.file = source;
+    print.paper = request.digits();
+    print.framesFolder = request.frames;
+    print.background = request.background;
+    if (!request.png)
+        return renderEditedPrintToJpeg(print, request.edit, &times);
+    const auto paper = renderEditedPrint(print, request.edit, &times);
+    if (!paper)
+        return paper.failure();
+    const auto start = std::chrono::steady_clock::now();
+    auto bytes = pngOf(*paper, source);
+    times.encode = millisecondsSince(start);
+    return bytes;
+}
+
+Result<QByteArray> scaled(const Request& request, const fs::path& source, PictureTimes& times) {
     const auto size = readPictureSize(source);
     if (!size)
         return size.failure();
     const bool small = request.mode == Request::Mode::Small;
     const PictureSize wanted = small ? smallPictureSize(*size, request.cell) : paperPictureSize(*size, *request.paper);
-    Result<QByteArray> bytes = QByteArray();
-    if (small || request.png) {
-        auto start = std::chrono::steady_clock::now();
-        const auto picture = loadPictureScaled(source, wanted);
-        times.draw = millisecondsSince(start);
-        if (!picture)
-            return picture.failure();
-        start = std::chrono::steady_clock::now();
-        bytes = pngOf(*picture, source);
-        times.encode = millisecondsSince(start);
-    } else {
-        bytes = scalePictureToJpeg(source, wanted, printQuality, &times);
-    }
+    if (!small && !request.png)
+        return scalePictureToJpeg(source, wanted, printQuality, &times);
+    auto start = std::chrono::steady_clock::now();
+    const auto picture = loadPictureScaled(source, wanted);
+    times.draw = millisecondsSince(start);
+    if (!picture)
+        return picture.failure();
+    start = std::chrono::steady_clock::now();
+    auto bytes = pngOf(*picture, source);
+    times.encode = millisecondsSince(start);
+    return bytes;
+}
+
+Result<void> render(const Request& request, const fs::path& source, const fs::path& target, PictureTimes& times) {
+    const auto bytes = request.mode == Request::Mode::Preview ? previewPng(request, source, times)
+                       : request.mode == Request::Mode::Print ? editedPrint(request, source, times)
+                                                              : scaled(request, source, times);
     return bytes ? writeWholeFile(target, *bytes) : bytes.failure();
 }
 
@@ -199,10 +272,15 @@ int main(int argc, char** argv) {
         complain(request->out.string() + " is no folder");
         return notUnderstood;
     }
-    const bool png = request->png || request->mode == Request::Mode::Small;
+    // Fonts come with the application object, and it takes its time to start: only where there is text to draw.
+    std::optional<QGuiApplication> application;
+    if (request->isEdited() && request->edit.TextOn == 1) {
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+        application.emplace(argc, argv);
+    }
     std::vector<fs::path> targets;
     for (const fs::path& file : request->files)
-        targets.push_back(request->out / (file.stem().string() + (png ? ".png" : ".jpg")));
+        targets.push_back(request->out / (file.stem().string() + (request->writesPng() ? ".png" : ".jpg")));
     if (!targetsAreFree(*request, targets))
         return notUnderstood;
 
@@ -214,7 +292,7 @@ int main(int argc, char** argv) {
             code = pictureFailed;
         } else if (request->time) {
             // A scaled load is one pass over the file: its decode and its draw can't be told apart.
-            if (png)
+            if (request->writesPng() && !request->isEdited())
                 std::printf("%s decode and draw %.1f encode %.1f\n", request->files[i].c_str(), times.draw,
                             times.encode);
             else

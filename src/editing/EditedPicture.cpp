@@ -1,0 +1,203 @@
+#include "editing/EditedPicture.h"
+
+#include "imaging/CaptionDraw.h"
+#include "imaging/ColourMatrix.h"
+#include "imaging/Resample.h"
+#include "imaging/Stopwatch.h"
+#include "platform/HostPath.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr float crossGain = 1.0F / 1000.0F;
+constexpr float greyWeight = 0.3F;
+constexpr int printQuality = 90;
+
+ColourMatrix coloursOf(const EditFields& edit) {
+    return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
+}
+
+Caption captionOf(const EditFields& edit) {
+    const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
+    Caption caption;
+    caption.text = edit.TextBody;
+    caption.family = edit.TextFont;
+    caption.emSize = edit.TextFontSize;
+    caption.bold = (edit.TextStyle & 1) != 0;
+    caption.italic = (edit.TextStyle & 2) != 0;
+    caption.align = edit.TextAlign == 1   ? Caption::Align::Centre
+                    : edit.TextAlign == 2 ? Caption::Align::Far
+                                          : Caption::Align::Near;
+    caption.run = edit.TextVertical == 3 ? Caption::Run::Down : Caption::Run::Across;
+    caption.colour = QColor(channel(edit.TextRed), channel(edit.TextGreen), channel(edit.TextBlue));
+    caption.x = edit.TextX;
+    caption.y = edit.TextY;
+    return caption;
+}
+
+// The one drawing of preview and print: picture, frame, caption over what the paper shows.
+void drawEdited(Bitmap& paper, const Bitmap* picture, const Placement& placement, const EditFields& edit,
+                const std::optional<Bitmap>& frame, PaperScale scale) {
+    if (picture != nullptr)
+        drawPlaced(paper, *picture, placement, coloursOf(edit));
+    if (frame)
+        drawKeyedFrame(paper, *frame);
+    if (edit.TextOn == 1)
+        drawCaption(paper, captionOf(edit), scale);
+}
+
+bool touches(const Placement& placement, PictureSize paper) {
+    const PictureSize size = placement.zoomed();
+    double left = 1e9;
+    double top = 1e9;
+    double right = -1e9;
+    double bottom = -1e9;
+    for (const int x : {0, size.width}) {
+        for (const int y : {0, size.height}) {
+            const Placement::Point corner = placement.onPaper(x, y);
+            left = std::min(left, corner.x);
+            right = std::max(right, corner.x);
+            top = std::min(top, corner.y);
+            bottom = std::max(bottom, corner.y);
+        }
+    }
+    return right > -1 && bottom > -1 && left < paper.width + 1 && top < paper.height + 1;
+}
+
+// One name and no way out of the folder it is looked up in.
+bool isPlainName(const QString& name) {
+    return !name.contains(u'/') && !name.contains(u'\\') && !name.contains(u':') &&
+           !name.contains(QStringLiteral("..")) && !name.contains(QChar(0)) && name != QStringLiteral(".");
+}
+
+Failure noRoom(const fs::path& file, PictureSize size) {
+    return {
+        Failure::Kind::TooLarge,
+        QStringLiteral("%1: no memory for a picture of %2 x %3").arg(toText(file)).arg(size.width).arg(size.height)};
+}
+
+} // namespace
+
+std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& edit, FrameUse use) {
+    const QString name = edit.FrameName.trimmed();
+    const QString folder = edit.FrameFolder.trimmed();
+    if (framesFolder.empty() || name.isEmpty() || name == QStringLiteral("000") || name == QStringLiteral("999") ||
+        !isPlainName(name) || !isPlainName(folder))
+        return std::nullopt;
+    const auto load = [&](const QString& leaf) -> std::optional<Bitmap> {
+        auto frame = loadPicture(framesFolder / toHostPath(folder) / toHostPath(leaf + QStringLiteral(".bmp")));
+        return frame ? std::optional(*frame) : std::nullopt;
+    };
+    if (use == FrameUse::Print) {
+        if (auto frame = load(name))
+            return frame;
+    }
+    return load(u'k' + name);
+}
+
+Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits paper, int zoomPercent, Tone tone) {
+    const auto size = readPictureSize(file);
+    if (!size)
+        return size.failure();
+    const auto workSize = workPictureSize(*size, zoomPercent);
+    if (!workSize)
+        return Failure{Failure::Kind::TooLarge, QStringLiteral("%1: a picture of %2 x %3 is too slim to be edited")
+                                                    .arg(toText(file))
+                                                    .arg(size->width)
+                                                    .arg(size->height)};
+    const auto work = loadPictureScaled(file, *workSize);
+    if (!work)
+        return work.failure();
+    EditedPreview preview;
+    preview.m_box = previewBox(paper, orientationOf(*size));
+    preview.m_work = onWhite(*work);
+    if (tone == Tone::Grey)
+        preview.turnGrey();
+    else
+        preview.stretchBackground();
+    if (preview.m_background.isNull())
+        return noRoom(file, preview.m_box);
+    return preview;
+}
+
+void EditedPreview::turnGrey() {
+    m_work = ColourMatrix::grey(greyWeight).applied(m_work);
+    stretchBackground();
+}
+
+void EditedPreview::stretchBackground() {
+    m_background = resampled(m_work, m_box);
+}
+
+void EditedPreview::placeAtCentreIfUnset(EditFields& edit) const {
+    constexpr int unset = 781;
+    if (edit.PanX < unset && edit.PanY < unset)
+        return;
+    edit.PanX = static_cast<std::int16_t>(m_box.width / 2);
+    edit.PanY = static_cast<std::int16_t>(m_box.height / 2);
+}
+
+void EditedPreview::setBackground(QColor colour) {
+    m_background = Bitmap(m_box.width, m_box.height, colour);
+}
+
+Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>& frame) const {
+    Bitmap paper = m_background;
+    drawEdited(paper, &m_work, previewPlacement({m_work.width(), m_work.height()}, m_box, edit), edit, frame, {});
+    return paper;
+}
+
+Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
+    Stopwatch watch(times);
+    const auto size = readPictureSize(print.file);
+    if (!size)
+        return size.failure();
+    const PrintGeometry geometry = printGeometry(print.paper, orientationOf(*size));
+    const Placement placement = printPlacement(*size, geometry, edit);
+    const bool shows = touches(placement, geometry.size);
+    const bool stretched = !print.background && !(shows && placement.covers(geometry.size));
+
+    // One decode serves both: what the placed picture needs, and where it leaves paper uncovered, what the stretched
+    // one needs.
+    PictureSize wanted{1, 1};
+    if (shows)
+        wanted = reducedSize(*size, placement);
+    if (stretched && !shows)
+        wanted = geometry.size;
+    else if (stretched)
+        wanted = {std::max(wanted.width, std::min(size->width, geometry.size.width)),
+                  std::max(wanted.height, std::min(size->height, geometry.size.height))};
+    auto loaded = loadPictureScaled(print.file, wanted);
+    if (!loaded)
+        return loaded.failure();
+    watch.add(&PictureTimes::decode);
+
+    Bitmap picture = onWhite(*loaded);
+    if (edit.ToneFlag == 1 && print.source == EditedPrint::Source::AsItIs)
+        picture = ColourMatrix::grey(greyWeight).applied(picture);
+    Bitmap paper = stretched ? resampled(picture, geometry.size)
+                             : Bitmap(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
+    if (paper.isNull())
+        return noRoom(print.file, geometry.size);
+    drawEdited(paper, shows ? &picture : nullptr, placement, edit, loadFrame(print.framesFolder, edit, FrameUse::Print),
+               {geometry.scaleX, geometry.scaleY});
+    watch.add(&PictureTimes::draw);
+    return paper;
+}
+
+Result<QByteArray> renderEditedPrintToJpeg(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
+    const auto paper = renderEditedPrint(print, edit, times);
+    if (!paper)
+        return paper.failure();
+    Stopwatch watch(times);
+    auto bytes = encodeJpeg(*paper, printQuality);
+    watch.add(&PictureTimes::encode);
+    return bytes;
+}
+
+} // namespace lumora

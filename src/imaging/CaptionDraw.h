@@ -1,0 +1,39 @@
+#pragma once
+
+#include "imaging/Bitmap.h"
+
+#include <QColor>
+#include <QString>
+
+namespace lumora {
+
+// A caption as an edit record carries it; sizes and places in pixels of the preview.
+struct Caption {
+    enum class Align { Near, Centre, Far };
+    enum class Run { Across, Down };
+
+    QString text;   // lines end in CR LF or LF
+    QString family; // one that this machine lacks draws nothing
+    int emSize = 8; // under 8 counts as 8
+    bool bold = false;
+    bool italic = false;
+    Align align = Align::Near;
+    Run run = Run::Across;
+    QColor colour = Qt::black;
+    int x = 0;
+    int y = 0;
+};
+
+// What the pixels of the preview become on the paper; 1 for the preview itself. Letters take their size by x.
+struct PaperScale {
+    double x = 1;
+    double y = 1;
+};
+
+// Draws the caption over its shadow: the shadow at the anchor, the text 2 pixels up and to the left. A line is its
+// advance and a third of an em long and starts a sixth inside that; it begins, is centred or ends at the anchor, whose
+// height is the top of the first line's box. Base direction left to right; lines that run down are the same block
+// turned a quarter clockwise, its right edge at the anchor. Needs a QGuiApplication.
+void drawCaption(Bitmap& paper, const Caption& caption, PaperScale scale = {});
+
+} // namespace lumora

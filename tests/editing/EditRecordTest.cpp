@@ -1,0 +1,93 @@
+#include "editing/EditRecord.h"
+#include "session/SessionState.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+TEST(EditRecord, KeepsTheFirstFourCharactersOfAGain) {
+    struct Case {
+        int hundredths, steps;
+        const char* stored;
+        float readBack;
+    };
+    const Case cases[] = {
+        {6, 1, "1.06", 1.06F},   {6, 5, "1.3 ", 1.3F},   {6, 8, "1.48", 1.48F},   {6, 9, "1.53", 1.53F},
+        {6, 10, "1.59", 1.59F},  {6, 17, "2.01", 2.01F}, {-6, 10, "0.4 ", 0.4F},  {-6, 15, "0.09", 0.09F},
+        {-6, 16, "0.03", 0.03F}, {-6, 17, "-0.0", 0.0F}, {-6, 19, "-0.1", -0.1F}, {4, 13, "1.52", 1.52F},
+        {4, 14, "1.55", 1.55F},  {4, 25, "1.99", 1.99F}, {-4, 2, "0.92", 0.92F},  {-4, 3, "0.87", 0.87F},
+        {-4, 24, "0.03", 0.03F}, {-4, 25, "-0.0", 0.0F},
+    };
+    for (const Case& expected : cases) {
+        EditFields edit;
+        for (int step = 0; step < expected.steps; ++step)
+            edit.GainR = EditStep::gain(edit.GainR, expected.hundredths);
+        PackEditState(edit, QStringLiteral("NB"), {});
+        EXPECT_EQ(edit.EditState.left(4).toStdString(), expected.stored);
+        EditFields back;
+        UnpackEditState(edit.EditState, back);
+        EXPECT_FLOAT_EQ(back.GainR, expected.readBack) << expected.stored;
+    }
+}
+
+TEST(EditRecord, CutsWhatIsTooLongForItsField) {
+    EditFields edit;
+    edit.RotationCode = -100;
+    edit.PanX = -1000;
+    edit.TextFontSize = 100;
+    edit.TextBody = QString(71, u'x');
+    PackEditState(edit, QStringLiteral("NB"), {});
+    EXPECT_EQ(edit.EditState.size(), EditRecord::width);
+    EXPECT_EQ(edit.EditState.mid(12, 3), QStringLiteral("-10"));
+    EXPECT_EQ(edit.EditState.mid(18, 4), QStringLiteral("-100"));
+    EXPECT_EQ(edit.EditState.mid(54, 2), QStringLiteral("10"));
+    EXPECT_EQ(edit.EditState.mid(126), QString(70, u'x') + QStringLiteral("    "));
+    edit.TextFontSize = 0;
+    PackEditState(edit, QStringLiteral("NB"), {});
+    EXPECT_EQ(edit.EditState.mid(54, 2), QStringLiteral("0 "));
+    UnpackEditState(edit.EditState, edit);
+    EXPECT_EQ(edit.TextFontSize, 8);
+}
+
+TEST(EditRecord, OfANewPictureThatWasOpenedHoldsTheCentreAndEveryField) {
+    EditFields edit;
+    UnpackEditState(EditRecord::newPicture(), edit);
+    edit.PanX = 225;
+    edit.PanY = 150;
+    PackEditState(edit, QStringLiteral("NB"), QStringLiteral("blue"));
+    const QString start = QStringLiteral("1   1   1   180100225 150 0  0  000000000000") + QString(10, u' ') +
+                          QStringLiteral("8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 ");
+    EXPECT_EQ(edit.EditState.toStdString(), start.leftJustified(EditRecord::width).toStdString());
+}
+
+TEST(EditRecord, CarriesTheOrdersBorderAsAFrame) {
+    struct Case {
+        const char *border, *frame, *folder, *frameAfter, *folderAfter;
+    };
+    for (const Case& expected :
+         {Case{"WB", "000", "", "001", "blue"}, Case{"BK", "000", "red", "002", "red"},
+          Case{"WB", "999", "", "999", ""}, Case{"NB", "000", "", "000", ""}, Case{"BK", "017", "", "017", ""}}) {
+        EditFields edit;
+        edit.FrameName = QString::fromLatin1(expected.frame);
+        edit.FrameFolder = QString::fromLatin1(expected.folder);
+        PackEditState(edit, QString::fromLatin1(expected.border), QStringLiteral("blue"));
+        EXPECT_EQ(edit.FrameName.toStdString(), expected.frameAfter);
+        EXPECT_EQ(edit.FrameFolder.toStdString(), expected.folderAfter);
+    }
+}
+
+TEST(EditStep, HoldsTheRangesOfEachButton) {
+    EXPECT_EQ(EditStep::zoom(210, 2), 210);
+    EXPECT_EQ(EditStep::zoom(40, -2), 40);
+    EXPECT_EQ(EditStep::turn(540, 1), 180);
+    EXPECT_EQ(EditStep::turn(180, -1), 179);
+    EXPECT_EQ(EditStep::turn(-32768, -1), -32768);
+    EXPECT_EQ(EditStep::quarterRight(500), 230);
+    EXPECT_EQ(EditStep::quarterRight(450), 540);
+    EXPECT_EQ(EditStep::quarterLeft(230), 500);
+    EXPECT_EQ(EditStep::quarterLeft(270), 180);
+}
+
+} // namespace
+} // namespace lumora

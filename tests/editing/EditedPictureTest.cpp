@@ -1,0 +1,219 @@
+#include "editing/EditedPicture.h"
+#include "editing/EditRecord.h"
+#include "imaging/CaptionDraw.h"
+#include "imaging/Resample.h"
+#include "session/SessionState.h"
+
+#include <QDir>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdlib>
+
+namespace lumora {
+namespace {
+
+class EditedPictureTest : public testing::Test {
+protected:
+    void SetUp() override {
+        ASSERT_TRUE(QDir(m_folder.path()).mkpath(QStringLiteral("frames/blue")));
+        saveFrame("frames/blue/kab.bmp", Qt::green);
+        saveFrame("frames/blue/ab.bmp", Qt::green);
+        saveFrame("frames/blue/kcd.bmp", Qt::yellow);
+        saveFrame("kout.bmp", Qt::red);
+        QImage soft(800, 600, QImage::Format_RGB32);
+        for (int y = 0; y < 600; ++y) {
+            for (int x = 0; x < 800; ++x)
+                soft.setPixel(x, y,
+                              qRgb(static_cast<int>(128 + 100 * std::sin(x / 37.0)), 40 + y / 4,
+                                   static_cast<int>(128 + 90 * std::cos((x + 2 * y) / 61.0))));
+        }
+        ASSERT_TRUE(soft.save(at("lying.png")));
+        ASSERT_TRUE(soft.transformed(QTransform().rotate(90)).save(at("upright.png")));
+    }
+
+    QString at(const char* name) const { return m_folder.path() + u'/' + QString::fromUtf8(name); }
+    std::filesystem::path path(const char* name) const { return at(name).toStdString(); }
+
+    // A coloured border on black, which shows the picture.
+    void saveFrame(const char* name, QColor colour) const {
+        QImage frame(120, 80, QImage::Format_RGB32);
+        frame.fill(colour);
+        for (int y = 8; y < 72; ++y) {
+            for (int x = 8; x < 112; ++x)
+                frame.setPixel(x, y, 0xFF000000);
+        }
+        ASSERT_TRUE(frame.save(at(name)));
+    }
+
+    Bitmap preview(const char* file, const EditFields& edit) const {
+        auto opened = EditedPreview::open(path(file), {10, 15}, edit.ZoomPercent,
+                                          edit.ToneFlag == 1 ? EditedPreview::Tone::Grey : EditedPreview::Tone::Colour);
+        if (!opened)
+            return {};
+        return opened->render(edit, loadFrame(path("frames"), edit, FrameUse::Preview));
+    }
+    Bitmap print(const char* file, const EditFields& edit) const {
+        EditedPrint request;
+        request.file = path(file);
+        request.paper = {10, 15};
+        request.framesFolder = path("frames");
+        const auto paper = renderEditedPrint(request, edit);
+        return paper ? *paper : Bitmap();
+    }
+
+    QTemporaryDir m_folder;
+};
+
+EditFields fieldsOf(const QString& record) {
+    EditFields edit;
+    UnpackEditState(record, edit);
+    return edit;
+}
+
+TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
+    struct Case {
+        const char *file, *record;
+    };
+    const Case cases[] = {
+        {"lying.png", "1   1   1   180100225 150 0  0  000"},
+        {"lying.png", "1   1   1   195150245 140 0  0  000"},
+        {"lying.png", "1   1   1   16760 200 170 0  0  000"},
+        {"lying.png", "1.3 1   0.8 360210300 90  1  0  000"},
+        {"lying.png", "0.87 1  1.48090100225 150 0  0  000"},
+        {"lying.png", "1   1   1   18140 780 780 0  0  000"},
+        {"lying.png", "1   1   1   180100999 999 0  0  000"},
+        {"lying.png", "1   1   1   180100225 150 0  0  ab 000000000blue"},
+        {"upright.png", "1   1   1.3 27080 130 217 1  0  cd 000000000blue"},
+        {"upright.png", "1   1   1   180100150 225 0  0  000000000000          242 0 0 1 ddd       30 255255150200"
+                        "0  0 1 DejaVu Sans                   Lumora 2024"},
+        {"upright.png", "1   1   1   180100150 225 0  0  000000000000          242 0 0 1 ddd       30 255255280200"
+                        "0  3 0 DejaVu Sans                   Lumora 2024"},
+    };
+    for (const Case& given : cases) {
+        const EditFields edit = fieldsOf(QString::fromLatin1(given.record));
+        const Bitmap seen = preview(given.file, edit);
+        const Bitmap full = print(given.file, edit);
+        ASSERT_FALSE(seen.isNull() || full.isNull()) << given.record;
+        const Bitmap reduced = resampled(full, {seen.width(), seen.height()});
+        // The edges of frames and letters, which may differ more, are counted in.
+        double sum = 0;
+        int counted = 0;
+        for (int y = 0; y < seen.height(); ++y) {
+            for (int x = 0; x < seen.width(); ++x) {
+                const QRgb a = seen.image().pixel(x, y);
+                const QRgb b = reduced.image().pixel(x, y);
+                sum += std::abs(qRed(a) - qRed(b)) + std::abs(qGreen(a) - qGreen(b)) + std::abs(qBlue(a) - qBlue(b));
+                counted += 3;
+            }
+        }
+        EXPECT_LE(sum / counted, 3.0) << given.record;
+        RecordProperty(given.record, QString::number(sum / counted).toStdString());
+    }
+}
+
+TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
+    const auto frame = [&](const char* folder, const char* name, FrameUse use) {
+        EditFields edit;
+        edit.FrameFolder = QString::fromLatin1(folder);
+        edit.FrameName = QString::fromLatin1(name);
+        const auto loaded = loadFrame(path("frames"), edit, use);
+        return loaded ? QColor(loaded->image().pixel(0, 0)) : QColor();
+    };
+    EXPECT_EQ(frame("blue", "ab", FrameUse::Preview), QColor(Qt::green));
+    EXPECT_EQ(frame("blue", "ab", FrameUse::Print), QColor(Qt::green));
+    EXPECT_EQ(frame("blue", "cd", FrameUse::Print), QColor(Qt::yellow)) << "what was seen is printed";
+    for (const char* folder : {"..", "blue/../..", "blue\\..\\..", "/tmp", "C:"})
+        EXPECT_FALSE(frame(folder, "out", FrameUse::Preview).isValid()) << folder;
+    for (const char* name : {"000", "999", "", "zz", "../../kout"})
+        EXPECT_FALSE(frame("blue", name, FrameUse::Preview).isValid()) << name;
+}
+
+TEST_F(EditedPictureTest, aPictureNeverOpenedPrintsStretchedToThePaper) {
+    const Bitmap paper = print("lying.png", fieldsOf(EditRecord::newPicture()));
+    ASSERT_EQ(paper.width(), 1500);
+    const auto whole = loadPictureScaled(path("lying.png"), {1500, 1000});
+    ASSERT_TRUE(whole);
+    EXPECT_EQ(paper.image(), whole->image().convertToFormat(paper.image().format()));
+}
+
+TEST_F(EditedPictureTest, aPictureThatCanNotBeReadIsAFailureAndARecordOfLettersIsNone) {
+    EXPECT_FALSE(EditedPreview::open(path("none.jpg"), {10, 15}, 100, EditedPreview::Tone::Colour));
+    EditedPrint request;
+    request.file = path("frames");
+    request.paper = {10, 15};
+    EXPECT_FALSE(renderEditedPrintToJpeg(request, EditFields()));
+    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'x'))).width(), 1500);
+    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'9'))).width(), 1500);
+    EXPECT_EQ(preview("lying.png", fieldsOf(QString(200, u'-'))).width(), 450);
+}
+
+// The box of the pixels that are not white.
+QRect inkOf(const Bitmap& paper) {
+    QRect ink;
+    for (int y = 0; y < paper.height(); ++y) {
+        for (int x = 0; x < paper.width(); ++x) {
+            if (qGreen(paper.image().pixel(x, y)) < 200)
+                ink |= QRect(x, y, 1, 1);
+        }
+    }
+    return ink;
+}
+
+QRect inkOfCaption(Caption::Align align, Caption::Run run, double scale = 1) {
+    Caption caption;
+    caption.text = QStringLiteral("HHHH\r\nH");
+    caption.family = QStringLiteral("DejaVu Sans");
+    caption.emSize = 24;
+    caption.align = align;
+    caption.run = run;
+    caption.x = 200;
+    caption.y = 150;
+    Bitmap paper(static_cast<int>(400 * scale), static_cast<int>(300 * scale), Qt::white);
+    drawCaption(paper, caption, {scale, scale});
+    return inkOf(paper);
+}
+
+TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
+    using Align = Caption::Align;
+    using Run = Caption::Run;
+    // Four letters of 0.752 em and a third of an em; the base line of the first line is 22 below the anchor, the pitch
+    // 28. The letter's own bearing is a tenth of an em.
+    const double length = 24 * (4 * 0.752 + 1 / 3.0);
+    struct Case {
+        Align align;
+        double start;
+    };
+    for (const Case& expected : {Case{Align::Near, 0}, Case{Align::Centre, -length / 2}, Case{Align::Far, -length}}) {
+        const QRect across = inkOfCaption(expected.align, Run::Across);
+        EXPECT_NEAR(across.left(), 200 + expected.start + 24 / 6.0 + 2.4 - 2, 1.6);
+        EXPECT_NEAR(across.top(), 150 + 22 - 17.5 - 2, 1.6);
+        EXPECT_NEAR(across.bottom(), 150 + 22 + 28, 1.6);
+        EXPECT_NEAR(across.width(), 4 * 0.752 * 24 - 4.8 + 2, 2.6) << "the second line lies within the first";
+        const QRect down = inkOfCaption(expected.align, Run::Down);
+        EXPECT_NEAR(down.top(), 150 + expected.start + 24 / 6.0 + 2.4 - 2, 1.6);
+        EXPECT_NEAR(down.right(), 200 - (22 - 17.5), 1.6);
+        EXPECT_LT(down.right(), 200);
+    }
+    const QRect small = inkOfCaption(Align::Centre, Run::Across);
+    const QRect large = inkOfCaption(Align::Centre, Run::Across, 10 / 3.0);
+    EXPECT_NEAR(large.left(), small.left() * 10 / 3.0, 4);
+    EXPECT_NEAR(large.width(), small.width() * 10 / 3.0, 6);
+}
+
+TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
+    Caption caption;
+    caption.text = QStringLiteral("שלום Lumora 2024");
+    caption.family = QStringLiteral("No Such Family");
+    Bitmap paper(200, 60, Qt::white);
+    drawCaption(paper, caption);
+    EXPECT_TRUE(inkOf(paper).isNull());
+    caption.family = QStringLiteral("David");
+    drawCaption(paper, caption);
+    EXPECT_FALSE(inkOf(paper).isNull());
+}
+
+} // namespace
+} // namespace lumora
