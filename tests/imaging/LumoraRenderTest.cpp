@@ -52,6 +52,21 @@ TEST_F(LumoraRenderTest, smallFillsTheCell) {
     EXPECT_EQ(QImage(at("out/a b.png")).size(), QSize(90, 68));
 }
 
+TEST_F(LumoraRenderTest, previewAndPrintTakeTheRecord) {
+    const QString record = QStringLiteral("1   1   1   27040 225 150 0  0  000");
+    EXPECT_EQ(
+        run({"preview", "--paper", "10/15", "--record", record, "--background", "204060", "--out", "out", "a b.jpg"}),
+        0)
+        << qPrintable(m_err);
+    const QImage preview(at("out/a b.png"));
+    EXPECT_EQ(preview.size(), QSize(450, 300));
+    EXPECT_EQ(preview.pixelColor(2, 2), QColor(0x20, 0x40, 0x60));
+    EXPECT_NE(preview.pixelColor(225, 150), QColor(0x20, 0x40, 0x60));
+    EXPECT_EQ(run({"print", "--paper", "10/15", "--record", record, "--time", "--out", "out", "a b.jpg"}), 0);
+    EXPECT_EQ(QImage(at("out/a b.jpg")).size(), QSize(1500, 1000));
+    EXPECT_TRUE(m_out.startsWith(QStringLiteral("a b.jpg decode "))) << qPrintable(m_out);
+}
+
 TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
     EXPECT_EQ(run({"plain", "--paper", "10/15", "--out", "out", "broken.jpg", "a b.jpg"}), 1);
     EXPECT_TRUE(m_err.contains(QStringLiteral("broken.jpg"))) << qPrintable(m_err);
@@ -65,8 +80,10 @@ TEST_F(LumoraRenderTest, aCallThatCanNotBeUnderstoodDoesNothing) {
          {QStringList{}, QStringList{"plain", "a b.jpg"}, QStringList{"plain", "--paper", "zz/zz", "a b.jpg"},
           QStringList{"plain", "--paper"}, QStringList{"small", "--size", "0", "--out", "out", "a b.jpg"},
           QStringList{"small", "--size", "9x", "--out", "out", "a b.jpg"}, QStringList{"large", "a b.jpg"},
-          QStringList{"small"}, QStringList{"small", "--sise", "90", "a b.jpg"},
-          QStringList{"small", "--out", "no such folder", "a b.jpg"},
+          QStringList{"small"}, QStringList{"print", "--out", "out", "a b.jpg"},
+          QStringList{"preview", "--paper", "10/15", "--background", "red", "--out", "out", "a b.jpg"},
+          QStringList{"print", "--paper", "10/15", "--frames", "no such folder", "--out", "out", "a b.jpg"},
+          QStringList{"small", "--sise", "90", "a b.jpg"}, QStringList{"small", "--out", "no such folder", "a b.jpg"},
           QStringList{"plain", "--paper", "10/15", "--out", ".", "a b.jpg"},
           QStringList{"plain", "--paper", "10/15", "--out", "out", "a b.jpg", "./a b.jpg"}}) {
         EXPECT_EQ(run(call), 2) << qPrintable(call.join(u' '));
