@@ -20,9 +20,9 @@
 
 namespace lumora {
 
-void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment)
-{
-    chain.registerPage(PageId::hatchala, [&] { return std::make_unique<hatchala>(state, platform, chain, deployment); });
+void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment) {
+    chain.registerPage(PageId::hatchala,
+                       [&] { return std::make_unique<hatchala>(state, platform, chain, deployment); });
     chain.registerPage(PageId::nnn, [&] { return std::make_unique<nnn>(state, platform, chain); });
     chain.registerPage(PageId::Havharot, [&] { return std::make_unique<Havharot>(state, platform, chain); });
     chain.registerPage(PageId::kyoskNew, [&] { return std::make_unique<kyoskNew>(state, platform, chain); });
@@ -32,8 +32,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
 }
 
-void registerViews(MainWindow& window, SessionState& state, const Files& files)
-{
+void registerViews(MainWindow& window, SessionState& state, const Files& files) {
     // A view is made for the page that its id stands for, so the page is of that class.
     window.registerView(PageId::hatchala, [&](Page& page, const Theme& theme) {
         return std::make_unique<hatchalaView>(static_cast<hatchala&>(page), state, theme, files);

@@ -36,8 +36,7 @@ struct Program::Parts {
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files)
-        , platform{files, dialogs, internet, shell, clock, pump, volume}
-    {
+        , platform{files, dialogs, internet, shell, clock, pump, volume} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
     }
 
@@ -57,14 +56,11 @@ struct Program::Parts {
 };
 
 Program::Program(ProgramOptions options)
-    : m_options(std::move(options))
-{
-}
+    : m_options(std::move(options)) {}
 
 Program::~Program() = default;
 
-Result<void> Program::start()
-{
+Result<void> Program::start() {
     assert(!m_parts);
     std::optional<HostPath> labFile = m_options.labFile;
     if (!labFile)
@@ -98,7 +94,8 @@ Result<void> Program::start()
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     registerViews(parts.window, parts.state, parts.files);
     // The process ends with the event loop, which may be one of a question: each of them has to come back.
-    QObject::connect(&parts.chain, &PageChain::ended, qApp, [] { QCoreApplication::exit(0); }, Qt::QueuedConnection);
+    QObject::connect(
+        &parts.chain, &PageChain::ended, qApp, [] { QCoreApplication::exit(0); }, Qt::QueuedConnection);
 
     QSize size = m_options.windowSize;
     if (size.isEmpty()) {
@@ -114,28 +111,23 @@ Result<void> Program::start()
     return {};
 }
 
-SessionState& Program::state()
-{
+SessionState& Program::state() {
     return m_parts->state;
 }
 
-PageChain& Program::chain()
-{
+PageChain& Program::chain() {
     return m_parts->chain;
 }
 
-MainWindow& Program::window()
-{
+MainWindow& Program::window() {
     return m_parts->window;
 }
 
-ScreenDialogs& Program::dialogs()
-{
+ScreenDialogs& Program::dialogs() {
     return m_parts->dialogs;
 }
 
-const Platform& Program::platform() const
-{
+const Platform& Program::platform() const {
     return m_parts->platform;
 }
 

@@ -8,16 +8,14 @@
 namespace lumora {
 
 Application::Application(int& argc, char** argv)
-    : QApplication(argc, argv)
-{
+    : QApplication(argc, argv) {
     setApplicationName(QStringLiteral("lumora"));
     setApplicationDisplayName(QStringLiteral("Lumora"));
     setQuitOnLastWindowClosed(false);
     Theme::apply(*this);
 }
 
-bool Application::notify(QObject* receiver, QEvent* event)
-{
+bool Application::notify(QObject* receiver, QEvent* event) {
     // No exception may pass through Qt's event loop: nothing behind it is certain to be whole.
     try {
         return QApplication::notify(receiver, event);

@@ -12,31 +12,27 @@ using namespace Qt::StringLiterals;
 
 CardButton::CardButton(const Theme& theme, QWidget* parent)
     : QAbstractButton(parent)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     setFocusPolicy(Qt::TabFocus);
     setAttribute(Qt::WA_Hover);
     setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Preferred);
 }
 
-void CardButton::setCardSize(double width, double height)
-{
+void CardButton::setCardSize(double width, double height) {
     m_size = {width, height};
     updateGeometry();
 }
 
-QSize CardButton::sizeHint() const
-{
+QSize CardButton::sizeHint() const {
     return {m_theme.px(m_size.width()), m_theme.px(m_size.height())};
 }
 
-QSize CardButton::minimumSizeHint() const
-{
-    return {std::max(m_theme.px(m_size.width() * 0.7), m_theme.target()), std::max(m_theme.px(m_size.height() * 0.8), m_theme.target())};
+QSize CardButton::minimumSizeHint() const {
+    return {std::max(m_theme.px(m_size.width() * 0.7), m_theme.target()),
+            std::max(m_theme.px(m_size.height() * 0.8), m_theme.target())};
 }
 
-void CardButton::paintEvent(QPaintEvent*)
-{
+void CardButton::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
     const double thick = isChecked() ? m_theme.px(3) : underMouse() && isEnabled() ? m_theme.px(2) : 1;
@@ -51,7 +47,8 @@ void CardButton::paintEvent(QPaintEvent*)
     paintInside(painter, card.adjusted(m_theme.px(12), m_theme.px(12), -m_theme.px(12), -m_theme.px(12)));
     if (isChecked()) {
         const double radius = m_theme.px(13);
-        const double side = layoutDirection() == Qt::RightToLeft ? card.left() + radius + m_theme.px(8) : card.right() - radius - m_theme.px(8);
+        const double side = layoutDirection() == Qt::RightToLeft ? card.left() + radius + m_theme.px(8)
+                                                                 : card.right() - radius - m_theme.px(8);
         const QPointF at(side, card.top() + radius + m_theme.px(8));
         painter.setPen(Qt::NoPen);
         painter.setBrush(Theme::Colour::Primary);
@@ -63,13 +60,11 @@ void CardButton::paintEvent(QPaintEvent*)
 
 Tile::Tile(const Theme& theme, QWidget* parent, QString icon)
     : CardButton(theme, parent)
-    , m_icon(std::move(icon))
-{
+    , m_icon(std::move(icon)) {
     setCardSize(290, 150);
 }
 
-void Tile::setExplanation(const QString& text)
-{
+void Tile::setExplanation(const QString& text) {
     if (m_explanation == text)
         return;
     m_explanation = text;
@@ -77,14 +72,12 @@ void Tile::setExplanation(const QString& text)
     update();
 }
 
-void Tile::setMarked(bool marked)
-{
+void Tile::setMarked(bool marked) {
     m_marked = marked;
     update();
 }
 
-void Tile::paintInside(QPainter& painter, const QRectF& room)
-{
+void Tile::paintInside(QPainter& painter, const QRectF& room) {
     if (room.height() > theme().px(170)) {
         paintUpright(painter, room);
         return;
@@ -93,7 +86,8 @@ void Tile::paintInside(QPainter& painter, const QRectF& room)
     const double disc = std::min<double>(theme().px(60), room.height() * 0.7);
     const double gap = theme().px(16);
     QRectF mark(0, 0, disc, disc);
-    mark.moveCenter({rightToLeft ? room.right() - disc / 2 - theme().px(4) : room.left() + disc / 2 + theme().px(4), room.center().y()});
+    mark.moveCenter({rightToLeft ? room.right() - disc / 2 - theme().px(4) : room.left() + disc / 2 + theme().px(4),
+                     room.center().y()});
     painter.save();
     painter.setPen(Qt::NoPen);
     painter.setBrush(m_marked ? Theme::Colour::Primary : Theme::Colour::PrimarySoft);
@@ -108,12 +102,14 @@ void Tile::paintInside(QPainter& painter, const QRectF& room)
         words.setRight(mark.left() - gap);
     else
         words.setLeft(mark.right() + gap);
-    const int flags = Qt::TextWordWrap | (rightToLeft ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute | Qt::AlignTop;
+    const int flags =
+        Qt::TextWordWrap | (rightToLeft ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute | Qt::AlignTop;
     painter.setLayoutDirection(layoutDirection());
     const QFont head = theme().font(Theme::Type::Large);
     const QFont body = theme().font(Theme::Type::Small);
     const QRectF headBox = QFontMetricsF(head).boundingRect(words, flags, text());
-    const QRectF bodyBox = m_explanation.isEmpty() ? QRectF() : QFontMetricsF(body).boundingRect(words, flags, m_explanation);
+    const QRectF bodyBox =
+        m_explanation.isEmpty() ? QRectF() : QFontMetricsF(body).boundingRect(words, flags, m_explanation);
     const double between = m_explanation.isEmpty() ? 0 : theme().px(4);
     double y = words.top() + std::max(0.0, (words.height() - headBox.height() - between - bodyBox.height()) / 2);
     painter.setFont(head);
@@ -124,8 +120,7 @@ void Tile::paintInside(QPainter& painter, const QRectF& room)
     painter.drawText(QRectF(words.left(), y, words.width(), words.bottom() - y + theme().px(8)), flags, m_explanation);
 }
 
-void Tile::paintUpright(QPainter& painter, const QRectF& room)
-{
+void Tile::paintUpright(QPainter& painter, const QRectF& room) {
     const double disc = theme().px(84);
     const int flags = Qt::TextWordWrap | Qt::AlignHCenter | Qt::AlignTop;
     painter.setLayoutDirection(layoutDirection());
@@ -133,7 +128,8 @@ void Tile::paintUpright(QPainter& painter, const QRectF& room)
     const QFont body = theme().font(Theme::Type::Body);
     const QRectF words = room.adjusted(theme().px(4), 0, -theme().px(4), 0);
     const double headHeight = QFontMetricsF(head).boundingRect(words, flags, text()).height();
-    const double bodyHeight = m_explanation.isEmpty() ? 0 : QFontMetricsF(body).boundingRect(words, flags, m_explanation).height();
+    const double bodyHeight =
+        m_explanation.isEmpty() ? 0 : QFontMetricsF(body).boundingRect(words, flags, m_explanation).height();
     double y = room.center().y() - (disc + theme().px(18) + headHeight + theme().px(6) + bodyHeight) / 2;
     const QRectF mark(room.center().x() - disc / 2, y, disc, disc);
     painter.save();
@@ -153,8 +149,7 @@ void Tile::paintUpright(QPainter& painter, const QRectF& room)
     painter.drawText(QRectF(words.left(), y, words.width(), bodyHeight + 2), flags, m_explanation);
 }
 
-void drawSamplePicture(QPainter& painter, const QRectF& box)
-{
+void drawSamplePicture(QPainter& painter, const QRectF& box) {
     painter.save();
     painter.setPen(Qt::NoPen);
     painter.setClipRect(box, Qt::IntersectClip);
@@ -164,11 +159,13 @@ void drawSamplePicture(QPainter& painter, const QRectF& box)
     painter.fillRect(box, sky);
     painter.setBrush(Theme::Colour::Sun);
     const double unit = std::min(box.width(), box.height());
-    painter.drawEllipse(QPointF(box.left() + box.width() * 0.30, box.top() + box.height() * 0.34), unit * 0.12, unit * 0.12);
+    painter.drawEllipse(QPointF(box.left() + box.width() * 0.30, box.top() + box.height() * 0.34), unit * 0.12,
+                        unit * 0.12);
     const auto hill = [&](QColor colour, double a, double b, double c) {
         QPainterPath path(box.bottomLeft());
         path.lineTo(box.left(), box.top() + box.height() * a);
-        path.quadTo(box.left() + box.width() * 0.45, box.top() + box.height() * b, box.right(), box.top() + box.height() * c);
+        path.quadTo(box.left() + box.width() * 0.45, box.top() + box.height() * b, box.right(),
+                    box.top() + box.height() * c);
         path.lineTo(box.bottomRight());
         path.closeSubpath();
         painter.setBrush(colour);
@@ -179,8 +176,7 @@ void drawSamplePicture(QPainter& painter, const QRectF& box)
     painter.restore();
 }
 
-void PaperCard::paintInside(QPainter& painter, const QRectF& room)
-{
+void PaperCard::paintInside(QPainter& painter, const QRectF& room) {
     QString size = text();
     size.remove(QChar(0x2066)).remove(QChar(0x2069)); // set apart for a Hebrew sentence
     const QStringList sides = size.split(u'/');
@@ -193,7 +189,8 @@ void PaperCard::paintInside(QPainter& painter, const QRectF& room)
     // All papers at one scale, so that a larger one looks larger; the largest that the lab cuts is 50 by 70.
     const double longer = std::max(first, second);
     const double share = std::clamp(0.62 + 0.38 * (longer - 10) / 30.0, 0.62, 1.0);
-    const QSizeF paper = QSizeF(std::max(first, second), std::min(first, second)).scaled(place.size() * share, Qt::KeepAspectRatio);
+    const QSizeF paper =
+        QSizeF(std::max(first, second), std::min(first, second)).scaled(place.size() * share, Qt::KeepAspectRatio);
     QRectF box(QPointF(), paper);
     box.moveCenter(place.center());
     painter.setPen(Qt::NoPen);
@@ -207,17 +204,15 @@ void PaperCard::paintInside(QPainter& painter, const QRectF& room)
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
     painter.setFont(theme().font(Theme::Type::Large));
     painter.setLayoutDirection(Qt::LeftToRight);
-    painter.drawText(QRectF(room.left(), room.bottom() - textHeight, room.width(), textHeight), Qt::AlignCenter, text());
+    painter.drawText(QRectF(room.left(), room.bottom() - textHeight, room.width(), textHeight), Qt::AlignCenter,
+                     text());
 }
 
 DrawingCard::DrawingCard(const Theme& theme, QWidget* parent, Drawing drawing)
     : CardButton(theme, parent)
-    , m_drawing(drawing)
-{
-}
+    , m_drawing(drawing) {}
 
-void DrawingCard::paintInside(QPainter& painter, const QRectF& room)
-{
+void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
     const double textHeight = theme().px(34);
     const QRectF place = room.adjusted(0, 0, 0, -textHeight);
     QRectF paper(QPointF(), QSizeF(3, 2).scaled(place.size(), Qt::KeepAspectRatio));
@@ -256,18 +251,17 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room)
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
     painter.setFont(theme().font(Theme::Type::Strong));
     painter.setLayoutDirection(layoutDirection());
-    painter.drawText(QRectF(room.left(), room.bottom() - textHeight, room.width(), textHeight), Qt::AlignCenter, text());
+    painter.drawText(QRectF(room.left(), room.bottom() - textHeight, room.width(), textHeight), Qt::AlignCenter,
+                     text());
 }
 
 BorderCard::BorderCard(const Theme& theme, QWidget* parent, QString code)
     : CardButton(theme, parent)
-    , m_code(std::move(code))
-{
+    , m_code(std::move(code)) {
     setCardSize(150, 140);
 }
 
-void BorderCard::drawSample(QPainter& painter, const QRectF& room, const QString& code)
-{
+void BorderCard::drawSample(QPainter& painter, const QRectF& room, const QString& code) {
     QRectF paper(QPointF(), QSizeF(3, 2).scaled(room.size(), Qt::KeepAspectRatio));
     paper.moveCenter(room.center());
     const double unit = paper.height();
@@ -312,27 +306,25 @@ void BorderCard::drawSample(QPainter& painter, const QRectF& room, const QString
     painter.restore();
 }
 
-void BorderCard::paintInside(QPainter& painter, const QRectF& room)
-{
+void BorderCard::paintInside(QPainter& painter, const QRectF& room) {
     const double textHeight = theme().px(40);
     drawSample(painter, room.adjusted(0, 0, 0, -textHeight), m_code);
     painter.setPen(Theme::Colour::Ink);
     painter.setFont(theme().font(Theme::Type::Small));
     painter.setLayoutDirection(layoutDirection());
-    painter.drawText(QRectF(room.left() - theme().px(8), room.bottom() - textHeight + theme().px(4), room.width() + theme().px(16), textHeight),
+    painter.drawText(QRectF(room.left() - theme().px(8), room.bottom() - textHeight + theme().px(4),
+                            room.width() + theme().px(16), textHeight),
                      Qt::AlignCenter | Qt::TextWordWrap, text());
 }
 
-void BorderSample::setCode(const QString& code)
-{
+void BorderSample::setCode(const QString& code) {
     if (m_code == code)
         return;
     m_code = code;
     update();
 }
 
-void BorderSample::paintEvent(QPaintEvent*)
-{
+void BorderSample::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     if (!m_code.isEmpty())
@@ -341,12 +333,9 @@ void BorderSample::paintEvent(QPaintEvent*)
 
 PictureBox::PictureBox(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
-}
+    , m_theme(theme) {}
 
-void PictureBox::setPicture(const QImage& picture)
-{
+void PictureBox::setPicture(const QImage& picture) {
     if (picture.cacheKey() == m_picture.cacheKey())
         return;
     m_picture = picture;
@@ -354,16 +343,16 @@ void PictureBox::setPicture(const QImage& picture)
     update();
 }
 
-void PictureBox::paintEvent(QPaintEvent*)
-{
+void PictureBox::paintEvent(QPaintEvent*) {
     if (m_picture.isNull())
         return;
     QPainter painter(this);
     const double ratio = devicePixelRatioF();
     const QSize fit = m_picture.size().scaled(size() * ratio, Qt::KeepAspectRatio);
     if (m_scaled.size() != fit) {
-        m_scaled = QPixmap::fromImage(fit == m_picture.size() ? m_picture
-                                                              : m_picture.scaled(fit, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
+        m_scaled = QPixmap::fromImage(fit == m_picture.size()
+                                          ? m_picture
+                                          : m_picture.scaled(fit, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
         m_scaled.setDevicePixelRatio(ratio);
     }
     const QSizeF at = m_scaled.deviceIndependentSize();

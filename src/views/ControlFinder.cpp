@@ -20,33 +20,29 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-Failure fail(const QString& text)
-{
+Failure fail(const QString& text) {
     return {Failure::Kind::Other, text};
 }
 
 // A point of the widget that is really on the window, also when a scroll area cuts it.
-QPoint middleOf(const QWidget& widget)
-{
+QPoint middleOf(const QWidget& widget) {
     return widget.visibleRegion().boundingRect().center();
 }
 
-void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held)
-{
-    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), Qt::LeftButton, held, Qt::NoModifier);
+void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held) {
+    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), Qt::LeftButton, held,
+                      Qt::NoModifier);
     QApplication::sendEvent(&widget, &event);
 }
 
-void click(QWidget& widget, QPoint at)
-{
+void click(QWidget& widget, QPoint at) {
     const QPointer<QWidget> alive(&widget);
     mouse(widget, at, QEvent::MouseButtonPress, Qt::LeftButton);
     if (alive && alive->isVisible())
         mouse(*alive, at, QEvent::MouseButtonRelease, Qt::NoButton);
 }
 
-void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers modifiers = Qt::NoModifier)
-{
+void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers modifiers = Qt::NoModifier) {
     QKeyEvent press(QEvent::KeyPress, code, modifiers, text);
     QApplication::sendEvent(&widget, &press);
     QKeyEvent release(QEvent::KeyRelease, code, modifiers, text);
@@ -54,29 +50,25 @@ void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers m
 }
 
 // What really takes the press: a list or a text area does so by its viewport.
-QWidget& target(QWidget& widget)
-{
+QWidget& target(QWidget& widget) {
     auto* area = qobject_cast<QAbstractScrollArea*>(&widget);
     return area ? *area->viewport() : widget;
 }
 
 } // namespace
 
-QString ControlFinder::frontPage() const
-{
+QString ControlFinder::frontPage() const {
     return m_window.frontView() ? pageName(m_window.frontView()->page().id()) : QString();
 }
 
-Result<PageView*> ControlFinder::view(const QString& page) const
-{
+Result<PageView*> ControlFinder::view(const QString& page) const {
     if (frontPage() != page)
         return fail(u"the page in front is %1, not %2"_s.arg(frontPage().isEmpty() ? u"none"_s : frontPage(), page));
     m_window.renderNow();
     return m_window.frontView();
 }
 
-QString ControlFinder::whyNotPressable(const QWidget& widget)
-{
+QString ControlFinder::whyNotPressable(const QWidget& widget) {
     if (!widget.isVisible() || widget.visibleRegion().isEmpty())
         return u"hidden"_s;
     if (!widget.isEnabled())
@@ -84,13 +76,14 @@ QString ControlFinder::whyNotPressable(const QWidget& widget)
     const QPoint at = middleOf(widget);
     QWidget* hit = widget.window()->childAt(widget.mapTo(widget.window(), at));
     if (hit != &widget && !(hit && widget.isAncestorOf(hit)))
-        return hit ? u"covered by %1"_s.arg(hit->objectName().isEmpty() ? QString::fromLatin1(hit->metaObject()->className()) : hit->objectName())
+        return hit ? u"covered by %1"_s.arg(hit->objectName().isEmpty()
+                                                ? QString::fromLatin1(hit->metaObject()->className())
+                                                : hit->objectName())
                    : u"outside the window"_s;
     return {};
 }
 
-Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& control) const
-{
+Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -104,8 +97,7 @@ Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& co
     return widget;
 }
 
-Result<void> ControlFinder::press(const QString& page, const QString& control) const
-{
+Result<void> ControlFinder::press(const QString& page, const QString& control) const {
     const Result<QWidget*> widget = pressable(page, control);
     if (!widget)
         return widget.failure();
@@ -115,8 +107,7 @@ Result<void> ControlFinder::press(const QString& page, const QString& control) c
     return {};
 }
 
-Result<void> ControlFinder::doublePress(const QString& page, const QString& control) const
-{
+Result<void> ControlFinder::doublePress(const QString& page, const QString& control) const {
     const Result<QWidget*> widget = pressable(page, control);
     if (!widget)
         return widget.failure();
@@ -131,8 +122,7 @@ Result<void> ControlFinder::doublePress(const QString& page, const QString& cont
     return {};
 }
 
-Result<void> ControlFinder::type(const QString& page, const QString& control, const QString& text) const
-{
+Result<void> ControlFinder::type(const QString& page, const QString& control, const QString& text) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)
         return found.failure();
@@ -150,8 +140,7 @@ Result<void> ControlFinder::type(const QString& page, const QString& control, co
     return {};
 }
 
-Result<void> ControlFinder::choose(const QString& page, const QString& control, const QString& text) const
-{
+Result<void> ControlFinder::choose(const QString& page, const QString& control, const QString& text) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)
         return found.failure();
@@ -181,8 +170,7 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
     return fail(u"%1.%2 has no rows"_s.arg(page, control));
 }
 
-Result<void> ControlFinder::tick(const QString& page, const QString& control, bool on) const
-{
+Result<void> ControlFinder::tick(const QString& page, const QString& control, bool on) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)
         return found.failure();
@@ -192,15 +180,15 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
     if (button->isChecked() != on) {
         const QRect box = button->rect();
         // Where its mark stands: a tick box answers only on its own contents.
-        click(*button, qobject_cast<QCheckBox*>(button)
-                           ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())
-                           : middleOf(*button));
+        click(*button,
+              qobject_cast<QCheckBox*>(button)
+                  ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())
+                  : middleOf(*button));
     }
     return {};
 }
 
-Result<QString> ControlFinder::text(const QString& page, const QString& control) const
-{
+Result<QString> ControlFinder::text(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -215,8 +203,7 @@ Result<QString> ControlFinder::text(const QString& page, const QString& control)
     return fail(u"%1 has no control %2"_s.arg(page, control));
 }
 
-Result<bool> ControlFinder::visible(const QString& page, const QString& control) const
-{
+Result<bool> ControlFinder::visible(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -226,8 +213,7 @@ Result<bool> ControlFinder::visible(const QString& page, const QString& control)
     return bound->widget && bound->widget->isVisible();
 }
 
-Result<bool> ControlFinder::enabled(const QString& page, const QString& control) const
-{
+Result<bool> ControlFinder::enabled(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -237,8 +223,7 @@ Result<bool> ControlFinder::enabled(const QString& page, const QString& control)
     return bound->widget ? bound->widget->isEnabled() : bound->caption && bound->caption->enabled;
 }
 
-Result<int> ControlFinder::count(const QString& page, const QString& control) const
-{
+Result<int> ControlFinder::count(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -248,8 +233,7 @@ Result<int> ControlFinder::count(const QString& page, const QString& control) co
     return bound->list->count();
 }
 
-Result<QString> ControlFinder::item(const QString& page, const QString& control, int index) const
-{
+Result<QString> ControlFinder::item(const QString& page, const QString& control, int index) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -257,7 +241,8 @@ Result<QString> ControlFinder::item(const QString& page, const QString& control,
     if (!bound || !bound->list)
         return fail(u"%1 has no list %2"_s.arg(page, control));
     if (index < 0 || index >= bound->list->count())
-        return fail(u"%1.%2 has %3 rows, none with the index %4"_s.arg(page, control).arg(bound->list->count()).arg(index));
+        return fail(
+            u"%1.%2 has %3 rows, none with the index %4"_s.arg(page, control).arg(bound->list->count()).arg(index));
     return bound->list->item(index);
 }
 

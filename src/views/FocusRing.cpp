@@ -9,8 +9,7 @@ namespace lumora {
 
 FocusRing::FocusRing(const Theme& theme, QWidget* window)
     : QWidget(window)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     setAttribute(Qt::WA_TransparentForMouseEvents);
     setFocusPolicy(Qt::NoFocus);
     setObjectName(QStringLiteral("focusRing"));
@@ -22,8 +21,7 @@ FocusRing::FocusRing(const Theme& theme, QWidget* window)
     });
 }
 
-bool FocusRing::eventFilter(QObject* watched, QEvent* event)
-{
+bool FocusRing::eventFilter(QObject* watched, QEvent* event) {
     switch (event->type()) {
     case QEvent::KeyPress:
         if (!m_keyboard) {
@@ -43,8 +41,8 @@ bool FocusRing::eventFilter(QObject* watched, QEvent* event)
     case QEvent::Resize:
     case QEvent::Show:
     case QEvent::Hide:
-        if (m_keyboard && m_target && watched->isWidgetType() && watched != this
-            && (watched == m_target || static_cast<QWidget*>(watched)->isAncestorOf(m_target)))
+        if (m_keyboard && m_target && watched->isWidgetType() && watched != this &&
+            (watched == m_target || static_cast<QWidget*>(watched)->isAncestorOf(m_target)))
             QTimer::singleShot(0, this, &FocusRing::follow);
         break;
     default:
@@ -53,10 +51,9 @@ bool FocusRing::eventFilter(QObject* watched, QEvent* event)
     return false;
 }
 
-void FocusRing::follow()
-{
-    if (!m_keyboard || !m_target || !m_target->isVisible() || m_target->window() != window() || m_target == window()
-        || m_target->property("ownRing").toBool()) {
+void FocusRing::follow() {
+    if (!m_keyboard || !m_target || !m_target->isVisible() || m_target->window() != window() || m_target == window() ||
+        m_target->property("ownRing").toBool()) {
         hide();
         return;
     }
@@ -69,8 +66,7 @@ void FocusRing::follow()
     show();
 }
 
-void FocusRing::paintEvent(QPaintEvent*)
-{
+void FocusRing::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     const double thick = m_theme.px(3);

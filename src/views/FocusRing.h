@@ -7,8 +7,8 @@
 
 namespace lumora {
 
-// The ring around the control that has the keyboard. It shows as soon as a person uses the keyboard and goes with the next
-// press of the mouse or a finger.
+// The ring around the control that has the keyboard. It shows as soon as a person uses the keyboard and goes with the
+// next press of the mouse or a finger.
 class FocusRing : public QWidget {
     Q_OBJECT
 public:

@@ -16,8 +16,7 @@ using namespace Qt::StringLiterals;
 
 Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page)
-{
+    , m_page(page) {
     frame().steps().setStep(OrderStep::Preparing);
     bindHidden(u"Label1"_s, page.Label1);
 
@@ -80,16 +79,20 @@ Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     auto* listColumn = new QVBoxLayout(m_listCard);
     listColumn->setContentsMargins(theme.px(16), theme.px(12), theme.px(16), theme.px(16));
     m_list = new QListWidget(m_listCard);
-    connect(m_list, &QListWidget::itemClicked, this, [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
-    connect(m_list, &QListWidget::itemActivated, this, [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
+    connect(m_list, &QListWidget::itemClicked, this,
+            [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
+    connect(m_list, &QListWidget::itemActivated, this,
+            [this](QListWidgetItem* item) { m_page.List1_Click(m_list->row(item)); });
     bindList(u"List1"_s, page.List1, m_list, [](const QString& line) { return LeafName(line); });
     listColumn->addWidget(m_list, 1);
-    listColumn->addWidget(button(u"Command1"_s, page.Command1, Role::Plain, [this] { m_page.Command1_Click(); }, u"trash"_s));
+    listColumn->addWidget(button(
+        u"Command1"_s, page.Command1, Role::Plain, [this] { m_page.Command1_Click(); }, u"trash"_s));
     side->addWidget(m_listCard, 4);
     row->addLayout(side, 2);
     frame().content()->addLayout(row, 1);
 
-    frame().addHeaderAction(button(u"Command7"_s, page.Command7, Role::Quiet, [this] { m_page.Command7_Click(); }, u"exit"_s));
+    frame().addHeaderAction(button(
+        u"Command7"_s, page.Command7, Role::Quiet, [this] { m_page.Command7_Click(); }, u"exit"_s));
     m_start = button(u"Command3"_s, page.Command3, Role::Main, [this] { m_page.Command3_Click(); });
     frame().addMainAction(m_start);
     m_total = makeLabel(this, "large");
@@ -106,13 +109,11 @@ Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     start();
 }
 
-QWidget* Form2View::firstFocus() const
-{
+QWidget* Form2View::firstFocus() const {
     return m_start;
 }
 
-void Form2View::render()
-{
+void Form2View::render() {
     frame().setTitle(m_page.Label1.text);
     const int all = m_page.progressMaximum;
     const double share = all > 0 ? static_cast<double>(m_page.progressValue) / all : 0;

@@ -30,8 +30,7 @@ constexpr double countdownFrom = 15;
 FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files)
     : PageView(page, state, theme)
     , m_page(page)
-    , m_files(files)
-{
+    , m_files(files) {
     frame().steps().setStep(OrderStep::Sending);
     auto* row = new QHBoxLayout;
     row->setSpacing(theme.px(28));
@@ -44,8 +43,7 @@ FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& the
     start();
 }
 
-QWidget* FtpFrmView::makeProgress()
-{
+QWidget* FtpFrmView::makeProgress() {
     auto* box = new QWidget(this);
     auto* column = new QVBoxLayout(box);
     column->setContentsMargins(0, 0, 0, 0);
@@ -97,8 +95,7 @@ QWidget* FtpFrmView::makeProgress()
     return box;
 }
 
-QWidget* FtpFrmView::makeSide()
-{
+QWidget* FtpFrmView::makeSide() {
     auto* box = new QWidget(this);
     auto* column = new QVBoxLayout(box);
     column->setContentsMargins(0, 0, 0, 0);
@@ -121,8 +118,9 @@ QWidget* FtpFrmView::makeSide()
     orderLines->addWidget(m_orderName);
     m_counts = makeLabel(order, "body");
     orderLines->addWidget(m_counts);
-    orderLines->addWidget(button(u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s), 0,
-                          Qt::AlignLeading);
+    orderLines->addWidget(button(
+                              u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s),
+                          0, Qt::AlignLeading);
 
     const auto [delivery, deliveryLines] = card("notice");
     m_delivery = delivery;
@@ -147,21 +145,26 @@ QWidget* FtpFrmView::makeSide()
     bind(u"Picture13"_s, m_proof, m_page.Picture13);
     column->addWidget(m_proof, 1);
     column->addStretch(1);
-    auto* fault = button(u"Command22"_s, m_page.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
+    auto* fault = button(
+        u"Command22"_s, m_page.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
     column->addWidget(fault, 0, Qt::AlignLeading);
-    column->addWidget(button(u"Command24"_s, m_page.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s), 0,
-                      Qt::AlignLeading);
+    column->addWidget(
+        button(
+            u"Command24"_s, m_page.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s),
+        0, Qt::AlignLeading);
     return box;
 }
 
-void FtpFrmView::makeBars()
-{
-    frame().addHeaderAction(button(u"Image3"_s, m_page.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
+void FtpFrmView::makeBars() {
+    frame().addHeaderAction(button(
+        u"Image3"_s, m_page.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
     m_exit = button(u"Command11"_s, m_page.Command11, Role::Secondary, [this] { m_page.Command11_Click(); });
     frame().addSecondaryAction(m_exit);
-    m_stop = button(u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"stop"_s);
+    m_stop = button(
+        u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"stop"_s);
     frame().addSecondaryAction(m_stop);
-    m_count = button(u"Command23"_s, m_page.Command23, Role::Secondary, [this] { m_page.Command23_Click(); }, u"pause"_s);
+    m_count = button(
+        u"Command23"_s, m_page.Command23, Role::Secondary, [this] { m_page.Command23_Click(); }, u"pause"_s);
     frame().addSecondaryAction(m_count);
     m_status = makeLabel(this, "large");
     m_status->setWordWrap(false);
@@ -175,8 +178,7 @@ void FtpFrmView::makeBars()
     frame().addMainAction(m_sendNow);
 }
 
-void FtpFrmView::makePanels()
-{
+void FtpFrmView::makePanels() {
     m_leave = new Overlay(theme(), this);
     m_leaveText = label(u"Picture7"_s, m_page.Picture7, "large");
     m_leave->column()->addWidget(m_leaveText);
@@ -187,7 +189,7 @@ void FtpFrmView::makePanels()
     auto* stay = button(u"Command14"_s, m_page.Command14, Role::Main, [this] { m_page.Command14_Click(); });
     row->addWidget(stay);
     m_leave->column()->addLayout(row);
-    m_leave->setCardWidth(760);
+    m_leave->setCardWidth(900);
     m_leave->setFirstFocus(stay);
     connect(m_leave, &Overlay::escaped, this, [this] { m_page.Command14_Click(); });
 
@@ -196,7 +198,8 @@ void FtpFrmView::makePanels()
     m_hiddenArea->setFilling();
     auto* lists = new QGridLayout;
     lists->setSpacing(theme().px(8));
-    const auto show = [&](int column, const QString& name, const TextList& list, const QString& hebrew, const QString& english) {
+    const auto show = [&](int column, const QString& name, const TextList& list, const QString& hebrew,
+                          const QString& english) {
         auto* title = makeLabel(m_hiddenArea, "smallMuted");
         auto* widget = new QListWidget(m_hiddenArea);
         widget->setFocusPolicy(Qt::NoFocus);
@@ -204,6 +207,8 @@ void FtpFrmView::makePanels()
         lists->addWidget(title, 0, column);
         lists->addWidget(widget, 1, column);
         m_listTitles.push_back({title, {hebrew, english}});
+        title->setBuddy(widget);
+        widget->setAccessibleName(name);
     };
     show(0, u"List3"_s, m_page.List3, u"קבצים לשליחה"_s, u"Files to be sent"_s);
     show(1, u"List6"_s, m_page.List6, u"נמצאים בשרת"_s, u"On the server"_s);
@@ -231,36 +236,53 @@ void FtpFrmView::makePanels()
     connect(m_hiddenArea, &Overlay::escaped, this, [this] { m_page.Command9_Click(); });
 }
 
-void FtpFrmView::bindTheRest()
-{
-    const std::pair<const char*, const Caption*> captions[] = {
-        {"Label7", &m_page.Label7}, {"Label20", &m_page.Label20}, {"Label33", &m_page.Label33}, {"LabelProg", &m_page.LabelProg},
-        {"Label4Nichshal", &m_page.Label4Nichshal}, {"Label31", &m_page.Label31}, {"Label4Missing", &m_page.Label4Missing},
-        {"Label4Mitoch", &m_page.Label4Mitoch}, {"Label12", &m_page.Label12}, {"Label4Yooadoo", &m_page.Label4Yooadoo},
-        {"Label4Hamtana", &m_page.Label4Hamtana}, {"Label4siem", &m_page.Label4siem}, {"Command12", &m_page.Command12},
-        {"Command18", &m_page.Command18}, {"Command21", &m_page.Command21}, {"Command8", &m_page.Command8},
-        {"Image6", &m_page.Image6}, {"Image10", &m_page.Image10}, {"Image11", &m_page.Image11}, {"Frame9", &m_page.Frame9},
-        {"Label4", &m_page.Label4}, {"Frame2", &m_page.Frame2}};
+void FtpFrmView::bindTheRest() {
+    const std::pair<const char*, const Caption*> captions[] = {{"Label7", &m_page.Label7},
+                                                               {"Label20", &m_page.Label20},
+                                                               {"Label33", &m_page.Label33},
+                                                               {"LabelProg", &m_page.LabelProg},
+                                                               {"Label4Nichshal", &m_page.Label4Nichshal},
+                                                               {"Label31", &m_page.Label31},
+                                                               {"Label4Missing", &m_page.Label4Missing},
+                                                               {"Label4Mitoch", &m_page.Label4Mitoch},
+                                                               {"Label12", &m_page.Label12},
+                                                               {"Label4Yooadoo", &m_page.Label4Yooadoo},
+                                                               {"Label4Hamtana", &m_page.Label4Hamtana},
+                                                               {"Label4siem", &m_page.Label4siem},
+                                                               {"Command12", &m_page.Command12},
+                                                               {"Command18", &m_page.Command18},
+                                                               {"Command21", &m_page.Command21},
+                                                               {"Command8", &m_page.Command8},
+                                                               {"Image6", &m_page.Image6},
+                                                               {"Image10", &m_page.Image10},
+                                                               {"Image11", &m_page.Image11},
+                                                               {"Frame9", &m_page.Frame9},
+                                                               {"Label4", &m_page.Label4},
+                                                               {"Frame2", &m_page.Frame2}};
     for (const auto& [name, caption] : captions)
         bindHidden(QString::fromLatin1(name), *caption);
-    const std::pair<const char*, const TextList*> lists[] = {
-        {"List1", &m_page.List1}, {"List2", &m_page.List2}, {"List4", &m_page.List4}, {"List5", &m_page.List5},
-        {"List8", &m_page.List8}, {"List9", &m_page.List9}, {"List4Makor", &m_page.List4Makor},
-        {"List4Broken", &m_page.List4Broken}, {"List4BrokenB", &m_page.List4BrokenB},
-        {"ListRezefFiles", &m_page.ListRezefFiles}, {"List4Tikiyot", &m_page.List4Tikiyot}};
+    const std::pair<const char*, const TextList*> lists[] = {{"List1", &m_page.List1},
+                                                             {"List2", &m_page.List2},
+                                                             {"List4", &m_page.List4},
+                                                             {"List5", &m_page.List5},
+                                                             {"List8", &m_page.List8},
+                                                             {"List9", &m_page.List9},
+                                                             {"List4Makor", &m_page.List4Makor},
+                                                             {"List4Broken", &m_page.List4Broken},
+                                                             {"List4BrokenB", &m_page.List4BrokenB},
+                                                             {"ListRezefFiles", &m_page.ListRezefFiles},
+                                                             {"List4Tikiyot", &m_page.List4Tikiyot}};
     for (const auto& [name, list] : lists)
         bindList(QString::fromLatin1(name), *list);
 }
 
-QWidget* FtpFrmView::firstFocus() const
-{
+QWidget* FtpFrmView::firstFocus() const {
     return m_sendNow;
 }
 
 // A button that hides hands the keyboard to its neighbour: the second half of a double press would stop what the first
 // half has started. While files travel nothing is chosen; in the end the main action is.
-void FtpFrmView::moveFocus(bool sending, QWidget* mainAction)
-{
+void FtpFrmView::moveFocus(bool sending, QWidget* mainAction) {
     if (frontOverlay(*window()) || std::exchange(m_wasSending, sending) == sending)
         return;
     if (sending)
@@ -269,8 +291,7 @@ void FtpFrmView::moveFocus(bool sending, QWidget* mainAction)
         mainAction->setFocus(Qt::OtherFocusReason);
 }
 
-void FtpFrmView::render()
-{
+void FtpFrmView::render() {
     const bool done = m_page.AllDone == 1;
     const bool counting = m_page.Timer1.running();
     const bool failed = !done && !m_page.sending && (m_page.Picture6.visible || m_page.Command10.visible);
@@ -289,7 +310,8 @@ void FtpFrmView::render()
     else if (m_page.sending)
         m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
     else
-        m_gauge->show(Val(m_page.Label33.text) / countdownFrom, m_page.Label33.text.trimmed(), wording(u"שניות"_s, u"seconds"_s));
+        m_gauge->show(Val(m_page.Label33.text) / countdownFrom, m_page.Label33.text.trimmed(),
+                      wording(u"שניות"_s, u"seconds"_s));
     m_gauge->setAccessibleName(m_page.sending ? m_page.LabelProg.text : m_page.Label4Do.text);
 
     m_failure->setVisible(failed && (m_page.Picture6.visible || m_page.Label4Reason.visible));
@@ -299,14 +321,16 @@ void FtpFrmView::render()
             words += part->text.trimmed();
         return words.join(u' ');
     };
-    m_failureLine->setText(isolated(join({&m_page.Label4Nichshal, &m_page.Label4Missing, &m_page.Label4Mitoch, &m_page.Label12,
-                                          &m_page.Label4Yooadoo})));
+    m_failureLine->setText(isolated(join({&m_page.Label4Nichshal, &m_page.Label4Missing, &m_page.Label4Mitoch,
+                                          &m_page.Label12, &m_page.Label4Yooadoo})));
     m_failureLine->setVisible(m_page.Picture6.visible);
 
     m_orderHead->setText(wording(u"ההזמנה שלך"_s, u"Your order"_s));
     // Folder names hold underscores and no blanks: they may break behind one.
     m_orderName->setText(QChar(0x2066) + QString(m_page.Label46.text).replace(u'_', u"_\u200B"_s) + QChar(0x2069));
-    m_counts->setText(isolated(wording(u"%1 תמונות, %2 קבצים"_s, u"%1 prints, %2 files"_s).arg(m_page.Label21.text.trimmed(), m_page.Label7.text.trimmed())));
+    m_counts->setText(isolated(wording(u"%1 תמונות, %2 קבצים"_s, u"%1 prints, %2 files"_s)
+                                   .arg(m_page.Label21.text.trimmed(), m_page.Label7.text.trimmed())));
+    m_orderName->setVisible(!m_page.Label46.text.isEmpty());
     m_counts->setVisible(!m_page.Label21.text.trimmed().isEmpty());
     m_order->setVisible(!done);
     m_delivery->setVisible(m_page.Label15.visible);
@@ -329,7 +353,8 @@ void FtpFrmView::render()
     }
 
     const QString total = m_page.Label21.text.trimmed();
-    m_status->setText(total.isEmpty() ? QString() : wording(u"תמונות בהזמנה: %1"_s, u"Prints in this order: %1"_s).arg(total));
+    m_status->setText(total.isEmpty() ? QString()
+                                      : wording(u"תמונות בהזמנה: %1"_s, u"Prints in this order: %1"_s).arg(total));
     // One main action at a time; the others that the page allows stand beside it or wait.
     m_sendNow->setVisible(m_page.Image5.visible && !failed && !done && !m_page.sending);
     m_sendAgain->setVisible(m_page.Command10.visible && failed);

@@ -8,12 +8,9 @@ namespace lumora {
 
 Gauge::Gauge(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
-}
+    , m_theme(theme) {}
 
-void Gauge::show(double share, const QString& large, const QString& small)
-{
+void Gauge::show(double share, const QString& large, const QString& small) {
     m_mood = Mood::Busy;
     m_share = std::clamp(share, 0.0, 1.0);
     m_large = large;
@@ -22,8 +19,7 @@ void Gauge::show(double share, const QString& large, const QString& small)
     update();
 }
 
-void Gauge::showSign(Mood mood)
-{
+void Gauge::showSign(Mood mood) {
     m_mood = mood;
     m_share = 1;
     m_large.clear();
@@ -31,25 +27,24 @@ void Gauge::showSign(Mood mood)
     update();
 }
 
-QSize Gauge::sizeHint() const
-{
+QSize Gauge::sizeHint() const {
     return {m_theme.px(230), m_theme.px(230)};
 }
 
-QSize Gauge::minimumSizeHint() const
-{
+QSize Gauge::minimumSizeHint() const {
     return {m_theme.px(150), m_theme.px(150)};
 }
 
-void Gauge::paintEvent(QPaintEvent*)
-{
+void Gauge::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     const double thick = m_theme.px(14);
     const double side = std::min(width(), height()) - thick - 2;
     QRectF ring(0, 0, side, side);
     ring.moveCenter(QRectF(rect()).center());
-    const QColor colour = m_mood == Mood::Good ? Theme::Colour::Good : m_mood == Mood::Bad ? Theme::Colour::Danger : Theme::Colour::Primary;
+    const QColor colour = m_mood == Mood::Good  ? Theme::Colour::Good
+                          : m_mood == Mood::Bad ? Theme::Colour::Danger
+                                                : Theme::Colour::Primary;
     painter.setPen(QPen(Theme::Colour::Sunken, thick));
     painter.drawEllipse(ring);
     painter.setPen(QPen(colour, thick, Qt::SolidLine, Qt::RoundCap));
@@ -57,8 +52,9 @@ void Gauge::paintEvent(QPaintEvent*)
         painter.drawArc(ring, 90 * 16, -static_cast<int>(m_share * 360 * 16));
     if (m_mood != Mood::Busy) {
         const int size = static_cast<int>(side * 0.5);
-        painter.drawPixmap(QPointF(ring.center().x() - size / 2.0, ring.center().y() - size / 2.0),
-                           m_theme.icon(m_mood == Mood::Good ? QStringLiteral("tick") : QStringLiteral("warning"), size, colour));
+        painter.drawPixmap(
+            QPointF(ring.center().x() - size / 2.0, ring.center().y() - size / 2.0),
+            m_theme.icon(m_mood == Mood::Good ? QStringLiteral("tick") : QStringLiteral("warning"), size, colour));
         return;
     }
     QFont font = m_theme.font(Theme::Type::Display);

@@ -6,8 +6,7 @@
 
 namespace lumora {
 
-bool pressByEnter(const QKeyEvent& event, QWidget* focus)
-{
+bool pressByEnter(const QKeyEvent& event, QWidget* focus) {
     if (event.key() != Qt::Key_Return && event.key() != Qt::Key_Enter)
         return false;
     if (auto* button = qobject_cast<QAbstractButton*>(focus)) {

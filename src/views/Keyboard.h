@@ -5,8 +5,8 @@ class QWidget;
 
 namespace lumora {
 
-// Enter presses what has the keyboard, as Space does: a button, a tick box, the list of a combo box. False when the key is
-// another one or nothing there can be pressed.
+// Enter presses what has the keyboard, as Space does: a button, a tick box, the list of a combo box. False when the key
+// is another one or nothing there can be pressed.
 bool pressByEnter(const QKeyEvent& event, QWidget* focus);
 
 } // namespace lumora

@@ -8,21 +8,20 @@ using namespace Qt::StringLiterals;
 
 LargePicture::LargePicture(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     setMinimumSize(theme.px(180), theme.px(120));
 }
 
-void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning)
-{
+void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning) {
     m_view = view;
     m_warning = warning;
-    setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified() : view.warning ? warning : u" "_s.trimmed());
+    setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified()
+                      : view.warning       ? warning
+                                           : u" "_s.trimmed());
     update();
 }
 
-void LargePicture::paintEvent(QPaintEvent*)
-{
+void LargePicture::paintEvent(QPaintEvent*) {
     if (!m_view.visible)
         return;
     QPainter painter(this);
@@ -35,12 +34,20 @@ void LargePicture::paintEvent(QPaintEvent*)
             if (!words.isEmpty() && words != QString(words.size(), u'<'))
                 lines += words;
         }
-        const int size = m_theme.px(44);
-        painter.drawPixmap(QPoint((width() - size) / 2, m_theme.px(10)), m_theme.icon(u"info"_s, size, Theme::Colour::Primary));
-        painter.setFont(m_theme.font(Theme::Type::Body));
+        const int flags = Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap;
         painter.setPen(Theme::Colour::Ink);
         painter.setLayoutDirection(layoutDirection());
-        painter.drawText(rect().adjusted(0, size + m_theme.px(20), 0, 0), Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap, lines.join(u"\n"_s));
+        painter.setFont(m_theme.font(Theme::Type::Body));
+        const int sign = m_theme.px(44);
+        QRect words = rect().adjusted(0, sign + m_theme.px(20), 0, 0);
+        if (painter.boundingRect(words, flags, lines.join(u'\n')).height() > words.height()) {
+            painter.setFont(m_theme.font(Theme::Type::Small)); // little room: the words alone, and smaller
+            words = rect();
+        } else {
+            painter.drawPixmap(QPoint((width() - sign) / 2, m_theme.px(10)),
+                               m_theme.icon(u"info"_s, sign, Theme::Colour::Primary));
+        }
+        painter.drawText(words, flags, lines.join(u'\n'));
         return;
     }
     const QImage& picture = m_view.bitmap.image();
@@ -55,7 +62,8 @@ void LargePicture::paintEvent(QPaintEvent*)
     const QRectF room(at.left(), at.top(), at.width(), m_theme.px(48));
     painter.fillRect(room, QColor(0xFD, 0xF0, 0xD9, 235));
     const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
-    painter.drawPixmap(QPointF(rightToLeft ? room.right() - icon - m_theme.px(8) : room.left() + m_theme.px(8), room.center().y() - icon / 2.0),
+    painter.drawPixmap(QPointF(rightToLeft ? room.right() - icon - m_theme.px(8) : room.left() + m_theme.px(8),
+                               room.center().y() - icon / 2.0),
                        m_theme.icon(u"warning"_s, icon, Theme::Colour::Danger));
     painter.setPen(Theme::Colour::Ink);
     painter.setLayoutDirection(layoutDirection());

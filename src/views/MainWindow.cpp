@@ -15,8 +15,7 @@ namespace lumora {
 MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     : m_chain(chain)
     , m_state(state)
-    , m_theme(std::make_unique<Theme>(1.0))
-{
+    , m_theme(std::make_unique<Theme>(1.0)) {
     setObjectName(QStringLiteral("lumoraWindow"));
     setAttribute(Qt::WA_StyledBackground);
     setWindowTitle(QStringLiteral("Lumora"));
@@ -29,31 +28,26 @@ MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     connect(&chain, &PageChain::unloaded, this, &MainWindow::pageUnloaded);
 }
 
-MainWindow::~MainWindow()
-{
+MainWindow::~MainWindow() {
     for (const auto& [page, view] : m_views)
         view->detach();
 }
 
-void MainWindow::registerView(PageId id, ViewMaker maker)
-{
+void MainWindow::registerView(PageId id, ViewMaker maker) {
     m_makers[id] = std::move(maker);
 }
 
-PageView* MainWindow::viewOf(const Page& page) const
-{
+PageView* MainWindow::viewOf(const Page& page) const {
     const auto at = m_views.find(&page);
     return at == m_views.end() ? nullptr : at->second;
 }
 
-void MainWindow::renderNow()
-{
+void MainWindow::renderNow() {
     if (m_front)
         m_front->renderNow();
 }
 
-PageView* MainWindow::make(Page& page)
-{
+PageView* MainWindow::make(Page& page) {
     const auto maker = m_makers.find(page.id());
     if (maker == m_makers.end())
         return nullptr;
@@ -68,8 +62,7 @@ PageView* MainWindow::make(Page& page)
     return view;
 }
 
-void MainWindow::pageShown(Page* page)
-{
+void MainWindow::pageShown(Page* page) {
     PageView* view = viewOf(*page);
     if (!view)
         view = make(*page);
@@ -77,8 +70,7 @@ void MainWindow::pageShown(Page* page)
         bringToFront(view);
 }
 
-void MainWindow::bringToFront(PageView* view)
-{
+void MainWindow::bringToFront(PageView* view) {
     m_front = view;
     setWindowTitle(QStringLiteral("Lumora")); // a page with a title of its own sets it as it renders
     m_stack->setCurrentWidget(view);
@@ -92,8 +84,7 @@ void MainWindow::bringToFront(PageView* view)
     Q_EMIT frontChanged();
 }
 
-void MainWindow::pageUnloaded(Page* page)
-{
+void MainWindow::pageUnloaded(Page* page) {
     PageView* view = viewOf(*page);
     if (!view)
         return;
@@ -104,15 +95,13 @@ void MainWindow::pageUnloaded(Page* page)
         m_front = nullptr;
 }
 
-void MainWindow::resizeEvent(QResizeEvent*)
-{
+void MainWindow::resizeEvent(QResizeEvent*) {
     const double factor = Theme::factorFor(size());
     if (factor != m_theme->factor())
         QTimer::singleShot(0, this, &MainWindow::rebuild);
 }
 
-void MainWindow::rebuild()
-{
+void MainWindow::rebuild() {
     const double factor = Theme::factorFor(size());
     if (factor == m_theme->factor())
         return;
@@ -138,8 +127,7 @@ void MainWindow::rebuild()
     Q_EMIT themeChanged();
 }
 
-void MainWindow::closeEvent(QCloseEvent* event)
-{
+void MainWindow::closeEvent(QCloseEvent* event) {
     event->ignore();
     m_chain.endProgram();
 }

@@ -11,16 +11,15 @@ namespace lumora {
 
 MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const QString& title, const QString& text,
                            const QStringList& buttons)
-    : Overlay(theme, parent)
-{
+    : Overlay(theme, parent) {
     setObjectName(QStringLiteral("messagePanel"));
     setAccessibleName(title.isEmpty() ? text.simplified() : title);
     setCardWidth(600);
     auto* top = new QHBoxLayout;
     top->setSpacing(theme.px(20));
     auto* sign = new QLabel(this);
-    sign->setPixmap(theme.icon(kind == Kind::Question ? QStringLiteral("info") : QStringLiteral("warning"), theme.px(44),
-                               Theme::Colour::Primary));
+    sign->setPixmap(theme.icon(kind == Kind::Question ? QStringLiteral("info") : QStringLiteral("warning"),
+                               theme.px(44), Theme::Colour::Primary));
     top->addWidget(sign, 0, Qt::AlignTop);
     auto* words = new QVBoxLayout;
     words->setSpacing(theme.px(8));

@@ -14,8 +14,7 @@ namespace lumora {
 
 Overlay::Overlay(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     hide();
     m_card = new QFrame(this);
     setRole(m_card, "card");
@@ -26,23 +25,21 @@ Overlay::Overlay(const Theme& theme, QWidget* parent)
     parent->installEventFilter(this);
 }
 
-void Overlay::setCardWidth(double width)
-{
+void Overlay::setCardWidth(double width) {
     m_width = width;
     place();
 }
 
-void Overlay::setFilling()
-{
+void Overlay::setFilling() {
     m_filling = true;
     place();
 }
 
-void Overlay::setOpen(bool open)
-{
+void Overlay::setOpen(bool open) {
     if (m_open == open)
         return;
     m_open = open;
+    window()->update();
     if (open) {
         m_before = QApplication::focusWidget();
         setGeometry(parentWidget()->rect());
@@ -58,8 +55,7 @@ void Overlay::setOpen(bool open)
     }
 }
 
-void Overlay::place()
-{
+void Overlay::place() {
     const int room = m_theme.px(24);
     const QSize available = size() - QSize(2 * room, 2 * room);
     QSize wanted = available;
@@ -70,30 +66,27 @@ void Overlay::place()
         height = std::max(height, m_card->minimumSizeHint().height());
         wanted = {width, std::min(height, available.height())};
     }
-    m_card->setGeometry((width() - wanted.width()) / 2, (height() - wanted.height()) / 2, wanted.width(), wanted.height());
+    m_card->setGeometry((width() - wanted.width()) / 2, (height() - wanted.height()) / 2, wanted.width(),
+                        wanted.height());
 }
 
-bool Overlay::eventFilter(QObject* watched, QEvent* event)
-{
+bool Overlay::eventFilter(QObject* watched, QEvent* event) {
     if (watched == parentWidget() && event->type() == QEvent::Resize && m_open)
         setGeometry(parentWidget()->rect());
     return QWidget::eventFilter(watched, event);
 }
 
-bool Overlay::event(QEvent* event)
-{
+bool Overlay::event(QEvent* event) {
     if (event->type() == QEvent::LayoutRequest)
         place();
     return QWidget::event(event);
 }
 
-void Overlay::resizeEvent(QResizeEvent*)
-{
+void Overlay::resizeEvent(QResizeEvent*) {
     place();
 }
 
-bool Overlay::focusNextPrevChild(bool next)
-{
+bool Overlay::focusNextPrevChild(bool next) {
     // The keyboard goes round inside the panel.
     QWidget* from = QApplication::focusWidget();
     QWidget* at = from ? from : this;
@@ -101,7 +94,9 @@ bool Overlay::focusNextPrevChild(bool next)
         at = next ? at->nextInFocusChain() : at->previousInFocusChain();
         if (at == from)
             return true;
-        if (at != this && isAncestorOf(at) && at->isVisible() && at->isEnabled() && (at->focusPolicy() & Qt::TabFocus)) {
+        // The box inside a combo box hands the keyboard back to it.
+        if (at != this && isAncestorOf(at) && !at->focusProxy() && at->isVisible() && at->isEnabled() &&
+            (at->focusPolicy() & Qt::TabFocus)) {
             at->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
             return true;
         }
@@ -109,8 +104,7 @@ bool Overlay::focusNextPrevChild(bool next)
     return true;
 }
 
-void Overlay::keyPressEvent(QKeyEvent* event)
-{
+void Overlay::keyPressEvent(QKeyEvent* event) {
     if (event->key() == Qt::Key_Escape) {
         Q_EMIT escaped();
         event->accept();
@@ -120,24 +114,25 @@ void Overlay::keyPressEvent(QKeyEvent* event)
     event->accept(); // nothing of the page below answers meanwhile
 }
 
-void Overlay::mousePressEvent(QMouseEvent* event)
-{
+void Overlay::mousePressEvent(QMouseEvent* event) {
     event->accept();
 }
 
-void Overlay::paintEvent(QPaintEvent*)
-{
-    QPainter(this).fillRect(rect(), Theme::Colour::Veil);
+void Overlay::paintEvent(QPaintEvent*) {
+    // One veil, however many panels lie one above the other.
+    if (frontOverlay(*window()) == this)
+        QPainter(this).fillRect(rect(), Theme::Colour::Veil);
 }
 
-Overlay* frontOverlay(const QWidget& root)
-{
+Overlay* frontOverlay(const QWidget& root) {
+    // A panel of the window itself lies above those of a page; among those of one parent the last child is in front.
+    const auto height = [&](const Overlay& overlay) {
+        return std::pair(overlay.parentWidget() == &root, overlay.parentWidget()->children().indexOf(&overlay));
+    };
     Overlay* front = nullptr;
     for (Overlay* overlay : root.findChildren<Overlay*>()) {
-        if (overlay->isVisible() && overlay->isOpen())
-            front = front && overlay->parentWidget()->children().indexOf(front) > overlay->parentWidget()->children().indexOf(overlay)
-                ? front
-                : overlay;
+        if (overlay->isOpen() && overlay->isVisible() && (!front || height(*front) < height(*overlay)))
+            front = overlay;
     }
     return front;
 }

@@ -10,7 +10,8 @@ class QVBoxLayout;
 
 namespace lumora {
 
-// A panel over a page: a veil over everything below, a card in the middle, and the keyboard kept inside while it is open.
+// A panel over a page: a veil over everything below, a card in the middle, and the keyboard kept inside while it is
+// open.
 class Overlay : public QWidget {
     Q_OBJECT
 public:

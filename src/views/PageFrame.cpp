@@ -1,14 +1,13 @@
 #include "views/PageFrame.h"
 
-#include <QLabel>
 #include <QHBoxLayout>
+#include <QLabel>
 #include <QVBoxLayout>
 #include <QVariant>
 
 namespace lumora {
 
-QLabel* makeLabel(QWidget* parent, const char* type)
-{
+QLabel* makeLabel(QWidget* parent, const char* type) {
     auto* label = new QLabel(parent);
     label->setProperty("type", QString::fromLatin1(type));
     label->setTextFormat(Qt::PlainText);
@@ -16,15 +15,13 @@ QLabel* makeLabel(QWidget* parent, const char* type)
     return label;
 }
 
-void setRole(QWidget* widget, const char* role)
-{
+void setRole(QWidget* widget, const char* role) {
     widget->setProperty("role", QString::fromLatin1(role));
 }
 
 PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(0);
@@ -84,35 +81,29 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     column->addWidget(bar);
 }
 
-void PageFrame::setTitle(const QString& title, const QString& subtitle)
-{
+void PageFrame::setTitle(const QString& title, const QString& subtitle) {
     m_title->setText(isolated(title));
     m_subtitle->setText(isolated(subtitle));
     m_subtitle->setVisible(!subtitle.isEmpty());
 }
 
-void PageFrame::setTitleVisible(bool visible)
-{
+void PageFrame::setTitleVisible(bool visible) {
     m_titleBlock->setVisible(visible);
 }
 
-void PageFrame::addHeaderAction(QWidget* widget)
-{
+void PageFrame::addHeaderAction(QWidget* widget) {
     m_headerActions->addWidget(widget);
 }
 
-void PageFrame::addMainAction(QWidget* widget)
-{
+void PageFrame::addMainAction(QWidget* widget) {
     m_main->addWidget(widget);
 }
 
-void PageFrame::addSecondaryAction(QWidget* widget)
-{
+void PageFrame::addSecondaryAction(QWidget* widget) {
     m_secondary->addWidget(widget);
 }
 
-void PageFrame::addStatus(QWidget* widget)
-{
+void PageFrame::addStatus(QWidget* widget) {
     m_status->addWidget(widget);
 }
 

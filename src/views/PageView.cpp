@@ -25,13 +25,11 @@ namespace {
 // About a frame of the screen: long loops pump far more often than a person can see.
 constexpr int renderPace = 16;
 
-QString shownOnButton(const QString& text)
-{
+QString shownOnButton(const QString& text) {
     return isolated(text.trimmed()).replace(u'&', u"&&"_s);
 }
 
-void fillCombo(QComboBox& box, const TextList& list, const Caption& caption)
-{
+void fillCombo(QComboBox& box, const TextList& list, const Caption& caption) {
     const QSignalBlocker quiet(box);
     bool same = box.count() == list.count();
     for (int i = 0; same && i < list.count(); ++i)
@@ -47,8 +45,7 @@ void fillCombo(QComboBox& box, const TextList& list, const Caption& caption)
         box.setCurrentIndex(row);
 }
 
-void fillList(QListWidget& widget, const TextList& list, const std::function<QString(const QString&)>& shown)
-{
+void fillList(QListWidget& widget, const TextList& list, const std::function<QString(const QString&)>& shown) {
     const QSignalBlocker quiet(widget);
     bool same = widget.count() == list.count();
     for (int i = 0; same && i < list.count(); ++i)
@@ -69,8 +66,7 @@ void fillList(QListWidget& widget, const TextList& list, const std::function<QSt
 PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
     : m_page(page)
     , m_state(state)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     setObjectName(pageName(page.id()));
     setRole(this, "page");
     setAttribute(Qt::WA_StyledBackground);
@@ -84,14 +80,12 @@ PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
     connect(&page, &Page::changed, this, &PageView::schedule);
 }
 
-void PageView::start()
-{
+void PageView::start() {
     m_dirty = true;
     renderNow();
 }
 
-void PageView::schedule()
-{
+void PageView::schedule() {
     m_dirty = true;
     if (m_detached || m_soon.isActive())
         return;
@@ -99,8 +93,7 @@ void PageView::schedule()
     m_soon.start(static_cast<int>(std::clamp<qint64>(renderPace - since, 0, renderPace)));
 }
 
-void PageView::renderNow()
-{
+void PageView::renderNow() {
     m_soon.stop();
     if (m_detached || !m_dirty)
         return;
@@ -115,21 +108,19 @@ void PageView::renderNow()
     m_sinceRender.start();
 }
 
-void PageView::detach()
-{
+void PageView::detach() {
     m_detached = true;
     m_soon.stop();
     disconnect(&m_page, &Page::changed, this, nullptr);
 }
 
-const PageView::Control* PageView::control(const QString& name) const
-{
-    const auto at = std::find_if(m_controls.begin(), m_controls.end(), [&](const Control& c) { return c.name == name; });
+const PageView::Control* PageView::control(const QString& name) const {
+    const auto at =
+        std::find_if(m_controls.begin(), m_controls.end(), [&](const Control& c) { return c.name == name; });
     return at == m_controls.end() ? nullptr : &*at;
 }
 
-void PageView::renderBindings()
-{
+void PageView::renderBindings() {
     for (const Control& control : m_controls) {
         QWidget* widget = control.widget;
         if (!widget)
@@ -157,7 +148,7 @@ void PageView::renderBindings()
             }
         } else if (auto* button = qobject_cast<QAbstractButton*>(widget)) {
             QString text = shownOnButton(caption.text);
-            if (!button->icon().isNull()) // some air between the sign and the word
+            if (!button->icon().isNull() && !text.isEmpty()) // some air between the sign and the word
                 text = QChar(0xA0) + text + QChar(0xA0);
             if (button->text() != text)
                 button->setText(text);
@@ -168,8 +159,10 @@ void PageView::renderBindings()
             if (label->text() != text)
                 label->setText(text);
         }
-        if (widget->isHidden() == caption.visible)
-            widget->setVisible(caption.visible);
+        // A label without a word takes no room.
+        const bool seen = caption.visible && !(qobject_cast<QLabel*>(widget) && caption.text.isEmpty());
+        if (widget->isHidden() == seen)
+            widget->setVisible(seen);
         if (widget->isEnabledTo(widget->parentWidget()) != caption.enabled)
             widget->setEnabled(caption.enabled);
         if (widget->toolTip() != caption.hint)
@@ -177,8 +170,7 @@ void PageView::renderBindings()
     }
 }
 
-void PageView::keyPressEvent(QKeyEvent* event)
-{
+void PageView::keyPressEvent(QKeyEvent* event) {
     QWidget* focus = QApplication::focusWidget();
     if (pressByEnter(*event, focus))
         return;
@@ -198,28 +190,28 @@ void PageView::keyPressEvent(QKeyEvent* event)
 }
 
 QPushButton* PageView::button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
-                              const QString& icon)
-{
+                              const QString& icon) {
     auto* made = new QPushButton(this);
     static constexpr const char* roles[] = {"main", "secondary", "plain", "quiet", "danger"};
     setRole(made, roles[static_cast<int>(role)]);
     made->setFocusPolicy(Qt::TabFocus);
     if (!icon.isEmpty())
-        setIcon(made, icon, role == Role::Main ? QColor(Qt::white) : role == Role::Danger ? Theme::Colour::Danger : Theme::Colour::Ink);
+        setIcon(made, icon,
+                role == Role::Main     ? QColor(Qt::white)
+                : role == Role::Danger ? Theme::Colour::Danger
+                                       : Theme::Colour::Ink);
     connect(made, &QPushButton::clicked, this, [clicked = std::move(clicked)] { clicked(); });
     bind(name, made, caption);
     return made;
 }
 
-QLabel* PageView::label(const QString& name, const Caption& caption, const char* type)
-{
+QLabel* PageView::label(const QString& name, const Caption& caption, const char* type) {
     QLabel* made = makeLabel(this, type);
     bind(name, made, caption);
     return made;
 }
 
-QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited)
-{
+QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited) {
     auto* made = new QLineEdit(this);
     made->setProperty("ownRing", true); // its border tells
     connect(made, &QLineEdit::textEdited, this, [edited = std::move(edited)](const QString& text) { edited(text); });
@@ -227,8 +219,7 @@ QLineEdit* PageView::field(const QString& name, const Caption& caption, std::fun
     return made;
 }
 
-QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked)
-{
+QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked) {
     auto* made = new QCheckBox(this);
     made->setFocusPolicy(Qt::TabFocus);
     connect(made, &QCheckBox::clicked, this, [this, clicked = std::move(clicked)](bool on) {
@@ -240,8 +231,7 @@ QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, 
 }
 
 QComboBox* PageView::comboBox(const QString& name, const TextList& list, const Caption& caption,
-                              std::function<void(int)> activated)
-{
+                              std::function<void(int)> activated) {
     auto* made = new QComboBox(this);
     made->setProperty("ownRing", true);
     connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
@@ -250,14 +240,13 @@ QComboBox* PageView::comboBox(const QString& name, const TextList& list, const C
     return made;
 }
 
-void PageView::bind(const QString& name, QWidget* widget, const Caption& caption)
-{
+void PageView::bind(const QString& name, QWidget* widget, const Caption& caption) {
     widget->setObjectName(name);
     m_controls.push_back({name, widget, &caption, nullptr, {}});
 }
 
-void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked)
-{
+void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
+                          std::function<void()> clicked) {
     button->setCheckable(true);
     connect(button, &QAbstractButton::clicked, this, [this, clicked = std::move(clicked)] {
         clicked();
@@ -266,26 +255,23 @@ void PageView::bindChoice(const QString& name, QAbstractButton* button, const Ch
     bind(name, button, caption);
 }
 
-void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text)
-{
+void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text) {
     widget->setObjectName(name);
     m_controls.push_back({name, widget, nullptr, nullptr, std::move(text)});
 }
 
-void PageView::bindHidden(const QString& name, const Caption& caption)
-{
+void PageView::bindHidden(const QString& name, const Caption& caption) {
     m_controls.push_back({name, nullptr, &caption, nullptr, {}});
 }
 
-void PageView::bindList(const QString& name, const TextList& list, QWidget* widget, std::function<QString(const QString&)> row)
-{
+void PageView::bindList(const QString& name, const TextList& list, QWidget* widget,
+                        std::function<QString(const QString&)> row) {
     if (widget)
         widget->setObjectName(name);
     m_controls.push_back({name, widget, nullptr, &list, {}, std::move(row)});
 }
 
-void PageView::setDirectedIcon(QPushButton* button, bool forwards)
-{
+void PageView::setDirectedIcon(QPushButton* button, bool forwards) {
     const bool right = forwards != (layoutDirection() == Qt::RightToLeft);
     const QString icon = right ? u"arrow-right"_s : u"arrow-left"_s;
     if (button->property("directedIcon") == icon)
@@ -295,15 +281,13 @@ void PageView::setDirectedIcon(QPushButton* button, bool forwards)
             button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
 }
 
-void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour)
-{
+void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour) {
     const int size = m_theme.px(24);
     button->setIcon(m_theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
     button->setIconSize({size, size});
 }
 
-void PageView::speak(QWidget* widget, const QString& text) const
-{
+void PageView::speak(QWidget* widget, const QString& text) const {
     widget->setProperty("spoken", true);
     widget->setAccessibleName(text);
 }

@@ -26,7 +26,8 @@ namespace lumora {
 class Overlay;
 
 // The base of all views. A control is bound to the page's state under its design name: text, visible, enabled and hint
-// follow the Caption at each rendering, and what the customer does calls the page's handler. render() sets what is more than that.
+// follow the Caption at each rendering, and what the customer does calls the page's handler. render() sets what is more
+// than that.
 class PageView : public QWidget {
     Q_OBJECT
 public:
@@ -40,7 +41,7 @@ public:
         QPointer<QWidget> widget;         // null for what the page holds and nobody sees
         const Caption* caption = nullptr; // one of the two tells what the control says
         const TextList* list = nullptr;
-        std::function<QString()> text;    // in place of the caption's
+        std::function<QString()> text;                   // in place of the caption's
         std::function<QString(const QString&)> row = {}; // what a person reads of a row of the list
     };
     const Control* control(const QString& name) const;
@@ -75,12 +76,14 @@ protected:
     QLineEdit* field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited);
     QCheckBox* checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked);
     // Rows from the list; what the box says from the caption, which may be a text that is no row.
-    QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption, std::function<void(int)> activated);
+    QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption,
+                        std::function<void(int)> activated);
 
     // Binds a widget of the view's own making.
     void bind(const QString& name, QWidget* widget, const Caption& caption);
     // A button of the view's own making that can be chosen.
-    void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked);
+    void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
+                    std::function<void()> clicked);
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
     // What has a name and is not seen.
     void bindHidden(const QString& name, const Caption& caption);

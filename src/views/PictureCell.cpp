@@ -13,8 +13,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 PictureCell::PictureCell(const Theme& theme, QWidget* parent)
-    : CardButton(theme, parent)
-{
+    : CardButton(theme, parent) {
     setCardSize(146, 160);
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     m_strip = new QWidget(this);
@@ -28,7 +27,7 @@ PictureCell::PictureCell(const Theme& theme, QWidget* parent)
         setRole(made, "round");
         made->setIcon(theme.buttonIcon(icon, theme.px(20), Theme::Colour::PrimaryDark, Theme::Colour::Muted));
         made->setIconSize({theme.px(20), theme.px(20)});
-        const int side = std::max(44, theme.px(44));
+        const int side = theme.key();
         made->setFixedSize(side, side);
         made->setFocusPolicy(Qt::TabFocus);
         return made;
@@ -44,8 +43,7 @@ PictureCell::PictureCell(const Theme& theme, QWidget* parent)
     m_strip->hide();
 }
 
-void PictureCell::show(const Look& look)
-{
+void PictureCell::show(const Look& look) {
     m_look = look;
     m_strip->setVisible(look.chosen);
     m_copies->setText(look.copies.trimmed());
@@ -53,28 +51,25 @@ void PictureCell::show(const Look& look)
     update();
 }
 
-QRect PictureCell::pictureRoom() const
-{
+QRect PictureCell::pictureRoom() const {
     const int inset = theme().px(7);
-    const int strip = std::max(44, theme().px(44)) + theme().px(4);
+    const int strip = theme().key() + theme().px(4);
     return rect().adjusted(inset, inset, -inset, -inset - strip);
 }
 
-int PictureCell::pictureSide() const
-{
+int PictureCell::pictureSide() const {
     const QRect room = pictureRoom();
     return static_cast<int>(std::min(room.width(), room.height()) * devicePixelRatioF());
 }
 
-void PictureCell::resizeEvent(QResizeEvent*)
-{
+void PictureCell::resizeEvent(QResizeEvent*) {
     const int inset = theme().px(6);
-    const int height = std::max(44, theme().px(44));
+    const int height = theme().key();
+    Q_EMIT resized();
     m_strip->setGeometry(inset, rect().height() - inset - height, width() - 2 * inset, height);
 }
 
-void PictureCell::keyPressEvent(QKeyEvent* event)
-{
+void PictureCell::keyPressEvent(QKeyEvent* event) {
     switch (event->key()) {
     case Qt::Key_Left:
         Q_EMIT arrow(-1, 0);
@@ -102,17 +97,21 @@ void PictureCell::keyPressEvent(QKeyEvent* event)
     }
 }
 
-void PictureCell::paintEvent(QPaintEvent*)
-{
+void PictureCell::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
-    const double thick = m_look.chosen ? theme().px(3) : m_look.inEditor ? theme().px(3) : underMouse() && m_look.filled ? theme().px(2) : 1;
+    const double thick = m_look.chosen                   ? theme().px(3)
+                         : m_look.inEditor               ? theme().px(3)
+                         : underMouse() && m_look.filled ? theme().px(2)
+                                                         : 1;
     const QRectF card = QRectF(rect()).adjusted(thick / 2, thick / 2, -thick / 2, -thick / 2);
-    painter.setPen(QPen(m_look.inEditor                              ? Theme::Colour::Sun
+    painter.setPen(QPen(m_look.inEditor                                    ? Theme::Colour::Sun
                         : m_look.chosen || (underMouse() && m_look.filled) ? Theme::Colour::Primary
-                                                                     : Theme::Colour::Line,
+                                                                           : Theme::Colour::Line,
                         thick));
-    painter.setBrush(m_look.chosen ? Theme::Colour::PrimarySoft : m_look.filled ? Theme::Colour::Surface : Theme::Colour::Paper);
+    painter.setBrush(m_look.chosen   ? Theme::Colour::PrimarySoft
+                     : m_look.filled ? Theme::Colour::Surface
+                                     : Theme::Colour::Paper);
     painter.drawRoundedRect(card, theme().px(14), theme().px(14));
     if (!m_look.filled)
         return;
@@ -130,11 +129,13 @@ void PictureCell::paintEvent(QPaintEvent*)
         painter.drawImage(at, m_look.picture);
     } else {
         const int size = theme().px(40);
-        painter.drawPixmap(room.center() - QPoint(size / 2, size / 2), theme().icon(u"picture"_s, size, Theme::Colour::Edge));
+        painter.drawPixmap(room.center() - QPoint(size / 2, size / 2),
+                           theme().icon(u"picture"_s, size, Theme::Colour::Edge));
     }
     if (m_look.chosen) {
         const double radius = theme().px(14);
-        const QPointF at(layoutDirection() == Qt::RightToLeft ? card.left() + radius + theme().px(5) : card.right() - radius - theme().px(5),
+        const QPointF at(layoutDirection() == Qt::RightToLeft ? card.left() + radius + theme().px(5)
+                                                              : card.right() - radius - theme().px(5),
                          card.top() + radius + theme().px(5));
         painter.setPen(QPen(Qt::white, theme().px(2)));
         painter.setBrush(Theme::Colour::Primary);
@@ -145,8 +146,11 @@ void PictureCell::paintEvent(QPaintEvent*)
         painter.setFont(theme().font(Theme::Type::Small));
         painter.setPen(Theme::Colour::Muted);
         const QRectF line(theme().px(8), m_strip->y(), width() - theme().px(16), m_strip->height());
-        painter.drawText(line, Qt::AlignCenter,
-                         QChar(0x2066) + painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle, static_cast<int>(line.width())) + QChar(0x2069));
+        painter.drawText(
+            line, Qt::AlignCenter,
+            QChar(0x2066) +
+                painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle, static_cast<int>(line.width())) +
+                QChar(0x2069));
     }
 }
 

@@ -8,11 +8,11 @@
 #include "views/PageFrame.h"
 
 #include <QHBoxLayout>
+#include <QKeyEvent>
 #include <QLabel>
+#include <QMouseEvent>
 #include <QPainter>
 #include <QPushButton>
-#include <QKeyEvent>
-#include <QMouseEvent>
 #include <QStandardPaths>
 #include <QStyledItemDelegate>
 #include <QVBoxLayout>
@@ -32,14 +32,13 @@ class CellPainter : public QStyledItemDelegate {
 public:
     CellPainter(const Theme& theme, QObject* parent)
         : QStyledItemDelegate(parent)
-        , m_theme(theme)
-    {
+        , m_theme(theme) {}
+
+    QSize sizeHint(const QStyleOptionViewItem&, const QModelIndex&) const override {
+        return {m_theme.px(166), m_theme.px(172)};
     }
 
-    QSize sizeHint(const QStyleOptionViewItem&, const QModelIndex&) const override { return {m_theme.px(166), m_theme.px(172)}; }
-
-    void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override
-    {
+    void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
         painter->save();
         painter->setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
         const QRectF cell = QRectF(option.rect).adjusted(m_theme.px(6), m_theme.px(6), -m_theme.px(6), -m_theme.px(6));
@@ -69,7 +68,8 @@ public:
         }
         painter->setFont(m_theme.font(Theme::Type::Small));
         painter->setPen(Theme::Colour::Ink);
-        const QRectF line(cell.left() + m_theme.px(8), cell.bottom() - m_theme.px(32), cell.width() - m_theme.px(16), m_theme.px(26));
+        const QRectF line(cell.left() + m_theme.px(8), cell.bottom() - m_theme.px(32), cell.width() - m_theme.px(16),
+                          m_theme.px(26));
         const QString name = painter->fontMetrics().elidedText(index.data(Qt::DisplayRole).toString(), Qt::ElideMiddle,
                                                                static_cast<int>(line.width()));
         painter->drawText(line, Qt::AlignCenter, name);
@@ -87,8 +87,7 @@ public:
     std::function<void()> up;
 
 protected:
-    void keyPressEvent(QKeyEvent* event) override
-    {
+    void keyPressEvent(QKeyEvent* event) override {
         if (event->key() == Qt::Key_Backspace)
             up();
         else if ((event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && currentItem())
@@ -100,28 +99,24 @@ protected:
     }
 
     // The first click of the two may have opened a folder; the second is not meant for what lies there now.
-    void mouseDoubleClickEvent(QMouseEvent* event) override
-    {
+    void mouseDoubleClickEvent(QMouseEvent* event) override {
         const QListWidgetItem* item = itemAt(event->position().toPoint());
         if (item && item->isSelected())
             QListWidget::mouseDoubleClickEvent(event);
     }
 };
 
-QString nameOf(const HostPath& path)
-{
+QString nameOf(const HostPath& path) {
     return toText(path.filename());
 }
 
-bool isJpeg(const HostPath& path)
-{
+bool isJpeg(const HostPath& path) {
     return toText(path.extension()).compare(u".jpg", Qt::CaseInsensitive) == 0;
 }
 
-// A picture whose last folder is remembered for the next pick of the same run would be another customer's business: the picker
-// opens at the first place that holds anything.
-bool holdsAnything(const HostPath& folder)
-{
+// A picture whose last folder is remembered for the next pick of the same run would be another customer's business: the
+// picker opens at the first place that holds anything.
+bool holdsAnything(const HostPath& folder) {
     std::error_code error;
     std::filesystem::directory_iterator at(folder, std::filesystem::directory_options::skip_permission_denied, error);
     return !error && at != std::filesystem::directory_iterator();
@@ -134,8 +129,7 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     : Overlay(theme, parent)
     , m_theme(theme)
     , m_state(state)
-    , m_files(files)
-{
+    , m_files(files) {
     setObjectName(u"picturePicker"_s);
     setAccessibleName(title.isEmpty() ? prompt : title);
     setFilling();
@@ -144,9 +138,10 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     head->setText(isolated(prompt.trimmed()));
     head->setObjectName(u"pickerPrompt"_s);
     column()->addWidget(head);
-    auto* guide = makeLabel(this, "body");
-    guide->setText(isolated(state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
-                                          u"Select only one image of a folder and the program will show you all the images"_s)));
+    auto* guide = makeLabel(this, "muted");
+    guide->setText(
+        isolated(state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                               u"Select only one image of a folder and the program will show you all the images"_s)));
     guide->setObjectName(u"pickerGuide"_s);
     column()->addWidget(guide);
 
@@ -160,10 +155,12 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     m_places = places(initialFolder);
     for (std::size_t i = 0; i < m_places.size(); ++i) {
         const Place& place = m_places[i];
-        auto* button = new QPushButton(theme.buttonIcon(place.icon, theme.px(24), Theme::Colour::Primary, Theme::Colour::Muted),
-                                       QString(), this);
+        auto* button = new QPushButton(
+            theme.buttonIcon(place.icon, theme.px(24), Theme::Colour::Primary, Theme::Colour::Muted), QString(), this);
         button->setIconSize({theme.px(24), theme.px(24)});
-        button->setText(button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, theme.px(130)).replace(u'&', u"&&"_s));
+        button->setText(
+            QChar(0xA0) +
+            button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, theme.px(130)).replace(u'&', u"&&"_s));
         button->setToolTip(toText(place.folder));
         button->setAccessibleName(place.name);
         button->setObjectName(u"place(%1)"_s.arg(i));
@@ -246,16 +243,17 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     m_reader.setInterval(0);
     connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
     setFirstFocus(m_grid);
-    const auto first = std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
+    const auto first =
+        std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
     open(first != m_places.end() ? first->folder : m_places.front().folder);
 }
 
-std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFolder) const
-{
+std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFolder) const {
     std::vector<Place> result;
     const auto add = [&](const QString& name, const QString& icon, const HostPath& folder) {
         std::error_code error;
-        const bool known = std::any_of(result.begin(), result.end(), [&](const Place& place) { return place.folder == folder; });
+        const bool known =
+            std::any_of(result.begin(), result.end(), [&](const Place& place) { return place.folder == folder; });
         if (!folder.empty() && !known && std::filesystem::is_directory(folder, error))
             result.push_back({name, icon, folder});
     };
@@ -284,8 +282,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
     return result;
 }
 
-void PicturePicker::open(const HostPath& folder)
-{
+void PicturePicker::open(const HostPath& folder) {
     m_folder = folder;
     m_reader.stop();
     m_unread.clear();
@@ -300,7 +297,8 @@ void PicturePicker::open(const HostPath& folder)
     }
     if (best < m_places.size())
         m_placeButtons[best]->setChecked(true);
-    m_where->setText(QChar(0x2066) + m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480)) + QChar(0x2069));
+    m_where->setText(QChar(0x2066) + m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480)) +
+                     QChar(0x2069));
     m_where->setToolTip(toText(folder));
 
     std::vector<HostPath> folders;
@@ -335,16 +333,17 @@ void PicturePicker::open(const HostPath& folder)
     for (const HostPath& path : pictures)
         add(path, false);
     m_empty->setVisible(m_grid->count() == 0);
-    m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s, u"This folder can't be opened. Choose another place."_s)
-                           : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s, u"There are no pictures here. Choose another place."_s));
+    m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
+                                             u"This folder can't be opened. Choose another place."_s)
+                           : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
+                                             u"There are no pictures here. Choose another place."_s));
     if (m_grid->count() > 0)
         m_grid->setCurrentRow(0, QItemSelectionModel::NoUpdate);
     if (!m_unread.empty())
         m_reader.start();
 }
 
-void PicturePicker::readNext()
-{
+void PicturePicker::readNext() {
     if (m_unread.empty()) {
         m_reader.stop();
         return;
@@ -375,8 +374,7 @@ void PicturePicker::readNext()
     item->setData(BrokenRole, true);
 }
 
-void PicturePicker::activate(const QListWidgetItem* item)
-{
+void PicturePicker::activate(const QListWidgetItem* item) {
     const HostPath path(item->data(PathRole).toByteArray().toStdString());
     if (item->data(FolderRole).toBool())
         open(path);
@@ -384,8 +382,7 @@ void PicturePicker::activate(const QListWidgetItem* item)
         Q_EMIT finished(AnsiCodePage::squeeze(m_files.drives().toDrive(path)));
 }
 
-void PicturePicker::take()
-{
+void PicturePicker::take() {
     if (const QListWidgetItem* item = m_grid->currentItem())
         activate(item);
 }

@@ -19,15 +19,15 @@ namespace lumora {
 class Files;
 struct SessionState;
 
-// The picker of one picture: the places at the side, memory cards first, and a grid of the folders and JPEG files of the
-// place that is open. A click chooses, a double click or Enter takes it. Small pictures are read one after another once
-// the grid stands, those in view first, so that a folder of thousands opens at once.
+// The picker of one picture: the places at the side, memory cards first, and a grid of the folders and JPEG files of
+// the place that is open. A click chooses, a double click or Enter takes it. Small pictures are read one after another
+// once the grid stands, those in view first, so that a folder of thousands opens at once.
 class PicturePicker : public Overlay {
     Q_OBJECT
 public:
     // initialFolder is a drive path; the picker opens there when no better place is known.
-    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files, const QString& prompt,
-                  const QString& initialFolder, const QString& title);
+    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
+                  const QString& prompt, const QString& initialFolder, const QString& title);
 
 Q_SIGNALS:
     // The drive path of the picture as the code page has it ("?" for what it lacks); empty for a cancel.

@@ -12,26 +12,23 @@ namespace lumora {
 ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files)
     : m_window(window)
     , m_state(state)
-    , m_files(files)
-{
-}
+    , m_files(files) {}
 
 ScreenDialogs::~ScreenDialogs() = default;
 
-void ScreenDialogs::message(const QString& text, const QString& title)
-{
+void ScreenDialogs::message(const QString& text, const QString& title) {
     shownTexts += text;
     m_waiting.append({text, title});
     if (!m_panel)
         showNext();
 }
 
-void ScreenDialogs::showNext()
-{
+void ScreenDialogs::showNext() {
     if (m_waiting.isEmpty())
         return;
     const Box& box = m_waiting.first();
-    m_panel = new MessagePanel(m_window.theme(), &m_window, MessagePanel::Kind::Message, box.title, box.text, {closingText()});
+    m_panel = new MessagePanel(m_window.theme(), &m_window, MessagePanel::Kind::Message, box.title, box.text,
+                               {closingText()});
     m_panel->setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     connect(m_panel, &MessagePanel::answered, this, [this, panel = m_panel] {
         if (m_panel != panel)
@@ -45,18 +42,15 @@ void ScreenDialogs::showNext()
     m_panel->setOpen(true);
 }
 
-QString ScreenDialogs::closingText() const
-{
+QString ScreenDialogs::closingText() const {
     return m_state.wording(QStringLiteral("הבנתי"), QStringLiteral("OK"));
 }
 
-QString ScreenDialogs::frontText() const
-{
+QString ScreenDialogs::frontText() const {
     return m_waiting.isEmpty() ? QString() : m_waiting.first().text;
 }
 
-void ScreenDialogs::closeMessages()
-{
+void ScreenDialogs::closeMessages() {
     m_waiting.clear();
     if (m_panel) {
         m_panel->setOpen(false);
@@ -65,8 +59,7 @@ void ScreenDialogs::closeMessages()
     }
 }
 
-bool ScreenDialogs::ask(const QString& question)
-{
+bool ScreenDialogs::ask(const QString& question) {
     shownTexts += question;
     if (nextAnswer) {
         if (const std::optional<bool> answer = nextAnswer())
@@ -88,8 +81,7 @@ bool ScreenDialogs::ask(const QString& question)
     return yes;
 }
 
-QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title)
-{
+QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title) {
     if (beforePick)
         beforePick();
     if (nextPick) {

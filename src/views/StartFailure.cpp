@@ -9,9 +9,9 @@
 
 namespace lumora {
 
-void showStartFailure(const QString& text)
-{
-    if (QGuiApplication::platformName() == QStringLiteral("offscreen") || QGuiApplication::platformName() == QStringLiteral("minimal"))
+void showStartFailure(const QString& text) {
+    if (QGuiApplication::platformName() == QStringLiteral("offscreen") ||
+        QGuiApplication::platformName() == QStringLiteral("minimal"))
         return;
     const Theme theme(1.0);
     QWidget window;

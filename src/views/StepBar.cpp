@@ -6,14 +6,12 @@ namespace lumora {
 
 StepBar::StepBar(const Theme& theme, QWidget* parent)
     : QWidget(parent)
-    , m_theme(theme)
-{
+    , m_theme(theme) {
     setObjectName(QStringLiteral("stepBar"));
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
 }
 
-void StepBar::setTexts(const QStringList& names, const QString& spokenPrefix)
-{
+void StepBar::setTexts(const QStringList& names, const QString& spokenPrefix) {
     m_names = names;
     m_spokenPrefix = spokenPrefix;
     speak();
@@ -21,30 +19,26 @@ void StepBar::setTexts(const QStringList& names, const QString& spokenPrefix)
     update();
 }
 
-void StepBar::setStep(OrderStep step)
-{
+void StepBar::setStep(OrderStep step) {
     m_step = step;
     speak();
     update();
 }
 
-void StepBar::speak()
-{
-    setAccessibleName(m_spokenPrefix + m_names.value(std::min(static_cast<int>(m_step), static_cast<int>(m_names.size()) - 1)));
+void StepBar::speak() {
+    setAccessibleName(m_spokenPrefix +
+                      m_names.value(std::min(static_cast<int>(m_step), static_cast<int>(m_names.size()) - 1)));
 }
 
-QSize StepBar::sizeHint() const
-{
+QSize StepBar::sizeHint() const {
     return {m_theme.px(600), m_theme.px(64)};
 }
 
-QSize StepBar::minimumSizeHint() const
-{
+QSize StepBar::minimumSizeHint() const {
     return {m_theme.px(440), m_theme.px(64)};
 }
 
-void StepBar::paintEvent(QPaintEvent*)
-{
+void StepBar::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     const int count = static_cast<int>(m_names.size());
@@ -59,7 +53,8 @@ void StepBar::paintEvent(QPaintEvent*)
         return QPointF(layoutDirection() == Qt::RightToLeft ? width() - along : along, y);
     };
     for (int i = 0; i + 1 < count; ++i) {
-        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.px(3), Qt::SolidLine, Qt::RoundCap));
+        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.px(3), Qt::SolidLine,
+                            Qt::RoundCap));
         const QPointF a = centre(i);
         const QPointF b = centre(i + 1);
         const double inset = (b.x() > a.x() ? 1 : -1) * (radius + m_theme.px(7));
@@ -79,11 +74,13 @@ void StepBar::paintEvent(QPaintEvent*)
         painter.drawEllipse(at, radius, radius);
         if (done) {
             const int size = m_theme.px(18);
-            painter.drawPixmap(QPointF(at.x() - size / 2.0, at.y() - size / 2.0), m_theme.icon(QStringLiteral("tick"), size, Qt::white));
+            painter.drawPixmap(QPointF(at.x() - size / 2.0, at.y() - size / 2.0),
+                               m_theme.icon(QStringLiteral("tick"), size, Qt::white));
         } else {
             painter.setFont(m_theme.font(Theme::Type::Small));
             painter.setPen(here ? QColor(Qt::white) : Theme::Colour::Muted);
-            painter.drawText(QRectF(at.x() - radius, at.y() - radius, 2 * radius, 2 * radius), Qt::AlignCenter, QString::number(i + 1));
+            painter.drawText(QRectF(at.x() - radius, at.y() - radius, 2 * radius, 2 * radius), Qt::AlignCenter,
+                             QString::number(i + 1));
         }
         QFont font = m_theme.font(Theme::Type::Small);
         font.setBold(here);

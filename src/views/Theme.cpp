@@ -16,20 +16,17 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-double Theme::factorFor(QSize window)
-{
+double Theme::factorFor(QSize window) {
     const double fit = std::min(window.width() / 1024.0, window.height() / 768.0);
     // Steps of a twentieth, so that dragging the window's edge does not build the page anew at each pixel.
     return std::clamp(std::floor(fit * 20.0) / 20.0, 0.75, 3.0);
 }
 
-int Theme::px(double length) const
-{
+int Theme::px(double length) const {
     return length == 0 ? 0 : std::max(1, static_cast<int>(std::lround(length * m_factor)));
 }
 
-QFont Theme::font(Type type) const
-{
+QFont Theme::font(Type type) const {
     QFont font = QApplication::font();
     switch (type) {
     case Type::Small:
@@ -58,8 +55,7 @@ QFont Theme::font(Type type) const
     return font;
 }
 
-QPixmap Theme::icon(const QString& name, int size, QColor colour) const
-{
+QPixmap Theme::icon(const QString& name, int size, QColor colour) const {
     QPixmap& pixmap = m_icons[{name, {size, colour.rgb()}}];
     if (pixmap.isNull()) {
         QFile file(u":/icons/"_s + name + u".svg"_s);
@@ -79,8 +75,7 @@ QPixmap Theme::icon(const QString& name, int size, QColor colour) const
     return pixmap;
 }
 
-QIcon Theme::buttonIcon(const QString& name, int size, QColor colour, QColor whenDisabled) const
-{
+QIcon Theme::buttonIcon(const QString& name, int size, QColor colour, QColor whenDisabled) const {
     QIcon result;
     result.addPixmap(icon(name, size, colour), QIcon::Normal);
     result.addPixmap(icon(name, size, whenDisabled), QIcon::Disabled);
@@ -89,15 +84,13 @@ QIcon Theme::buttonIcon(const QString& name, int size, QColor colour, QColor whe
 
 namespace {
 
-QString hex(QColor colour)
-{
+QString hex(QColor colour) {
     return colour.name();
 }
 
 } // namespace
 
-QString Theme::styleSheet() const
-{
+QString Theme::styleSheet() const {
     // Lengths stand as @12 (scaled) and colours as $Ink, so that the sheet reads as one.
     static const QString sheet = QString::fromUtf8(R"(
 * { color: $Ink; font-size: @17px; }
@@ -138,7 +131,8 @@ QPushButton[role="quiet"]:hover { background: $Sunken; }
 QPushButton[role="danger"] { border-color: $Danger; color: $Danger; }
 QPushButton[role="danger"]:hover { background: $DangerSoft; border-color: $Danger; }
 QPushButton[role="danger"]:disabled { border-color: $Line; color: $Muted; }
-QPushButton[role="round"] { padding: 0; border-radius: %halfTargetpx; }
+QPushButton[role="tall"] { min-height: @52px; padding: 0 @8px; font-size: @15px; }
+QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }
 
 QLineEdit, QPlainTextEdit, QComboBox { min-height: %targetpx; padding: 0 @14px; border: 2px solid $Edge; border-radius: @12px;
   background: $Surface; selection-background-color: $Primary; selection-color: white; font-size: @19px; }
@@ -170,16 +164,27 @@ QScrollBar::add-line, QScrollBar::sub-line, QScrollBar::add-page, QScrollBar::su
 QToolTip { background: $Ink; color: white; border: none; padding: @6px @10px; }
 )");
     QString result = sheet;
-    const std::pair<const char*, QColor> colours[] = {
-        {"$PrimaryDark", Colour::PrimaryDark}, {"$PrimarySoft", Colour::PrimarySoft}, {"$Primary", Colour::Primary},
-        {"$Paper", Colour::Paper}, {"$Surface", Colour::Surface}, {"$Sunken", Colour::Sunken}, {"$Line", Colour::Line},
-        {"$Edge", Colour::Edge}, {"$Ink", Colour::Ink}, {"$Muted", Colour::Muted}, {"$SunSoft", Colour::SunSoft},
-        {"$Sun", Colour::Sun}, {"$DangerSoft", Colour::DangerSoft}, {"$Danger", Colour::Danger},
-        {"$GoodSoft", Colour::GoodSoft}, {"$Good", Colour::Good}};
+    const std::pair<const char*, QColor> colours[] = {{"$PrimaryDark", Colour::PrimaryDark},
+                                                      {"$PrimarySoft", Colour::PrimarySoft},
+                                                      {"$Primary", Colour::Primary},
+                                                      {"$Paper", Colour::Paper},
+                                                      {"$Surface", Colour::Surface},
+                                                      {"$Sunken", Colour::Sunken},
+                                                      {"$Line", Colour::Line},
+                                                      {"$Edge", Colour::Edge},
+                                                      {"$Ink", Colour::Ink},
+                                                      {"$Muted", Colour::Muted},
+                                                      {"$SunSoft", Colour::SunSoft},
+                                                      {"$Sun", Colour::Sun},
+                                                      {"$DangerSoft", Colour::DangerSoft},
+                                                      {"$Danger", Colour::Danger},
+                                                      {"$GoodSoft", Colour::GoodSoft},
+                                                      {"$Good", Colour::Good}};
     for (const auto& [name, colour] : colours)
         result.replace(QLatin1StringView(name), hex(colour));
     result.replace("%target"_L1, QString::number(target() - 2));
-    result.replace("%halfTarget"_L1, QString::number(target() / 2));
+    result.replace("%key"_L1, QString::number(key() - 2));
+    result.replace("%halfKey"_L1, QString::number(key() / 2));
     static const QRegularExpression length(u"@(\\d+)"_s);
     QString scaled;
     qsizetype from = 0;
@@ -193,8 +198,7 @@ QToolTip { background: $Ink; color: white; border: none; padding: @6px @10px; }
     return scaled;
 }
 
-void Theme::apply(QApplication& application)
-{
+void Theme::apply(QApplication& application) {
     QApplication::setStyle(QStyleFactory::create(u"Fusion"_s));
     // What texts name "David" comes with the free Hebrew fonts under a name of its own.
     QFont::insertSubstitution(u"David"_s, u"David CLM"_s);
@@ -215,11 +219,10 @@ void Theme::apply(QApplication& application)
     QApplication::setPalette(palette);
 }
 
-QString isolated(const QString& text)
-{
+QString isolated(const QString& text) {
     // Paths, addresses of the web and of mail, sizes, "3 / 12", percentages, telephone numbers.
     static const QRegularExpression ownDirection(
-        u"[A-Za-z]:\\\\[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+|\\d+(?:\\s*[/x:.,_-]\\s*\\d+)+\\s?%?|\\d+\\s?%|\\+\\d+"_s);
+        u"[A-Za-z]:\\\\[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+|\\d+(?:\\s*[/x:.,_-]\\s*\\d+)+(?:\\s?%)?|\\d+\\s?%|\\+\\d+"_s);
     QString result = text;
     result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     qsizetype shift = 0;

@@ -54,7 +54,8 @@ public:
     int corner() const { return px(14); }
     // No control that can be pressed is smaller than this, on any window.
     int target() const { return px(48) < 44 ? 44 : px(48); }
-    int mainActionHeight() const { return px(60); }
+    // Plus and minus of a small picture: as small as a target may be.
+    int key() const { return px(44) < 44 ? 44 : px(44); }
 
     enum class Type { Small, Body, Strong, Large, Title, Display };
     QFont font(Type type) const;

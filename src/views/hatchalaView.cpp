@@ -25,8 +25,7 @@ public:
     using QWidget::QWidget;
 
 protected:
-    void paintEvent(QPaintEvent*) override
-    {
+    void paintEvent(QPaintEvent*) override {
         QPainter painter(this);
         painter.setRenderHint(QPainter::Antialiasing);
         const double unit = std::min(width() / 1.25, height() / 1.0);
@@ -56,8 +55,7 @@ protected:
 hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files)
     : PageView(page, state, theme)
     , m_page(page)
-    , m_files(files)
-{
+    , m_files(files) {
     frame().steps().setStep(OrderStep::Start);
     frame().setTitleVisible(false);
 
@@ -70,7 +68,8 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     connect(m_english, &QPushButton::clicked, this, [this](bool on) { m_page.Check1_Click(on); });
     bind(u"Check1"_s, m_english, page.Check1);
     frame().addHeaderAction(m_english);
-    auto* leave = button(u"Image3"_s, page.Image3, Role::Quiet, [this] { m_page.Image3_MouseDown(); }, u"exit"_s);
+    auto* leave = button(
+        u"Image3"_s, page.Image3, Role::Quiet, [this] { m_page.Image3_MouseDown(); }, u"exit"_s);
     frame().addHeaderAction(leave);
 
     // Content: words at the beginning of the reading direction, the picture beside them.
@@ -103,8 +102,10 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     words->addStretch(1);
     auto* links = new QHBoxLayout;
     links->setSpacing(theme.gap());
-    auto* prices = button(u"Image11"_s, page.Image11, Role::Plain, [this] { m_page.Image11_Click(); }, u"tag"_s);
-    auto* site = button(u"Image5"_s, page.Image5, Role::Plain, [this] { m_page.Image5_Click(); }, u"globe"_s);
+    auto* prices = button(
+        u"Image11"_s, page.Image11, Role::Plain, [this] { m_page.Image11_Click(); }, u"tag"_s);
+    auto* site = button(
+        u"Image5"_s, page.Image5, Role::Plain, [this] { m_page.Image5_Click(); }, u"globe"_s);
     links->addWidget(prices);
     links->addWidget(site);
     links->addStretch(1);
@@ -157,15 +158,19 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     m_shops->column()->addWidget(m_ask);
     auto* list = new QListWidget(m_shops);
     list->setMinimumHeight(theme.px(170));
-    connect(list, &QListWidget::itemClicked, this, [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
-    connect(list, &QListWidget::itemActivated, this, [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
+    connect(list, &QListWidget::itemClicked, this,
+            [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
+    connect(list, &QListWidget::itemActivated, this,
+            [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
     bindList(u"List1"_s, page.List1, list);
     m_shops->column()->addWidget(list);
     m_shops->setFirstFocus(list);
     m_shopList = list;
     bind(u"Picture1"_s, new QWidget(m_shops), page.Picture1);
 
-    m_hovers = {{m_start, hatchala::Hover::Image1}, {prices, hatchala::Hover::Image11}, {site, hatchala::Hover::Image5},
+    m_hovers = {{m_start, hatchala::Hover::Image1},
+                {prices, hatchala::Hover::Image11},
+                {site, hatchala::Hover::Image5},
                 {leave, hatchala::Hover::Image3}};
     for (const auto& [widget, over] : m_hovers)
         widget->installEventFilter(this);
@@ -182,8 +187,7 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     start();
 }
 
-bool hatchalaView::eventFilter(QObject* watched, QEvent* event)
-{
+bool hatchalaView::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() == QEvent::Enter || event->type() == QEvent::Leave) {
         for (const auto& [widget, over] : m_hovers) {
             if (widget == watched && !isDetached())
@@ -193,13 +197,11 @@ bool hatchalaView::eventFilter(QObject* watched, QEvent* event)
     return PageView::eventFilter(watched, event);
 }
 
-QWidget* hatchalaView::firstFocus() const
-{
+QWidget* hatchalaView::firstFocus() const {
     return m_start;
 }
 
-void hatchalaView::render()
-{
+void hatchalaView::render() {
     setDirectedIcon(m_start, true);
     m_start->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight); // the arrow behind the word
     m_how->setText(wording(u"הדפסת תמונות בשלושה צעדים פשוטים:"_s, u"Printing pictures takes three simple steps:"_s));
@@ -221,8 +223,9 @@ void hatchalaView::render()
     }
     m_advert->setVisible(m_advert->hasPicture());
     const QString question = m_page.List1Caption.text.trimmed();
-    m_ask->setText(!question.isEmpty() ? question
-                                       : wording(u"היכן תרצה לקבל את התמונות?"_s, u"Where do you want to receive the pictures?"_s));
+    m_ask->setText(!question.isEmpty()
+                       ? question
+                       : wording(u"היכן תרצה לקבל את התמונות?"_s, u"Where do you want to receive the pictures?"_s));
     speak(m_shops, m_ask->text());
     speak(m_shopList, m_ask->text());
     m_shops->setOpen(m_page.Picture1.visible);

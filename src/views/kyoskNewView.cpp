@@ -29,12 +29,29 @@ namespace {
 // Four in a row, so that the large picture stands beside them.
 constexpr int columns = 4;
 
+// A long text stands in two lines, broken at the blank nearest to its middle.
+void breakLong(QPushButton& button) {
+    QString text = button.text();
+    const int room = button.width() - button.fontMetrics().horizontalAdvance(u"MMM"_s);
+    if (room <= 0 || text.contains(u'\n') || button.fontMetrics().horizontalAdvance(text) <= room)
+        return;
+    const qsizetype middle = text.size() / 2;
+    for (qsizetype away = 0; away < middle; ++away) {
+        for (const qsizetype at : {middle - away, middle + away}) {
+            if (text[at] == u' ') {
+                text[at] = u'\n';
+                button.setText(text);
+                return;
+            }
+        }
+    }
+}
+
 } // namespace
 
 kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page)
-{
+    , m_page(page) {
     frame().steps().setStep(OrderStep::Pictures);
     frame().setTitleVisible(false);
     frame().content()->setSpacing(theme.px(8));
@@ -43,11 +60,14 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     m_body = new QStackedLayout(body);
     m_body->addWidget(makeEmpty());
     auto* pictures = new QWidget(body);
+    // The small pictures stand on the left in both languages, and run from left to right: so the page's texts say.
+    pictures->setLayoutDirection(Qt::LeftToRight);
     auto* row = new QHBoxLayout(pictures);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(theme.px(20));
     row->addWidget(makeGrid(), 2);
-    row->addWidget(makeSide(), 1);
+    m_side = makeSide();
+    row->addWidget(m_side, 1);
     m_body->addWidget(pictures);
     frame().content()->addWidget(body, 1);
     makeBars();
@@ -61,8 +81,7 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     start();
 }
 
-QLayout* kyoskNewView::makeTopRow()
-{
+QLayout* kyoskNewView::makeTopRow() {
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().px(10));
     auto* words = new QVBoxLayout;
@@ -73,8 +92,8 @@ QLayout* kyoskNewView::makeTopRow()
     bind(u"Label29"_s, m_folder, [this] { return m_page.Label29.text; });
     words->addWidget(m_folder);
     row->addLayout(words, 1);
-    row->addWidget(button(u"Image8"_s, m_page.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"eraser"_s));
-    row->addWidget(button(u"Command14"_s, m_page.Command14, Role::Plain, [this] { m_page.Command14_Click(); }, u"check-circle"_s));
+    row->addWidget(button(
+        u"Command14"_s, m_page.Command14, Role::Plain, [this] { m_page.Command14_Click(); }, u"check-circle"_s));
     m_previous = button(u"Image15"_s, m_page.Image15, Role::Plain, [this] { m_page.Image15_Click(); });
     m_next = button(u"Image16"_s, m_page.Image16, Role::Plain, [this] { m_page.Image16_Click(); });
     row->addWidget(m_previous);
@@ -82,8 +101,7 @@ QLayout* kyoskNewView::makeTopRow()
     return row;
 }
 
-QWidget* kyoskNewView::makeGrid()
-{
+QWidget* kyoskNewView::makeGrid() {
     auto* box = new QWidget(this);
     auto* grid = new QGridLayout(box);
     grid->setContentsMargins(0, 0, 0, 0);
@@ -94,11 +112,12 @@ QWidget* kyoskNewView::makeGrid()
         auto* cell = new PictureCell(theme(), box);
         m_cells[at] = cell;
         connect(cell, &QAbstractButton::clicked, this, [this, i] { m_page.Picture1_Click(i); });
+        if (i == 0)
+            connect(cell, &PictureCell::resized, this,
+                    [this] { QTimer::singleShot(0, this, &kyoskNewView::fitCells); });
         connect(cell->plus(), &QPushButton::clicked, this, [this, i] { m_page.Command12_Click(i); });
         connect(cell->minus(), &QPushButton::clicked, this, [this, i] { m_page.Command13_Click(i); });
         connect(cell, &PictureCell::arrow, this, [this, i](int across, int down) {
-            if (layoutDirection() == Qt::RightToLeft)
-                across = -across;
             const int column = i % columns + across;
             const int next = i + across + down * columns;
             if (column < 0 || column >= columns || next < 0 || next >= static_cast<int>(cellsOfPage))
@@ -119,8 +138,7 @@ QWidget* kyoskNewView::makeGrid()
     return box;
 }
 
-QWidget* kyoskNewView::makeEmpty()
-{
+QWidget* kyoskNewView::makeEmpty() {
     auto* box = new QFrame(this);
     setRole(box, "well");
     auto* column = new QVBoxLayout(box);
@@ -148,8 +166,7 @@ QWidget* kyoskNewView::makeEmpty()
     return box;
 }
 
-QWidget* kyoskNewView::makeSide()
-{
+QWidget* kyoskNewView::makeSide() {
     auto* box = new QWidget(this);
     auto* column = new QVBoxLayout(box);
     column->setContentsMargins(0, 0, 0, 0);
@@ -162,10 +179,12 @@ QWidget* kyoskNewView::makeSide()
     m_large = new LargePicture(theme(), card);
     bind(u"Picture2"_s, m_large, [this] { return m_page.Picture2.guide.join(u'\n'); });
     inside->addWidget(m_large, 1);
-    auto* row = new QHBoxLayout;
-    row->addWidget(label(u"Label6"_s, m_page.Label6, "strong"), 1);
-    row->addWidget(button(u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"rotate"_s));
-    inside->addLayout(row);
+    auto* grade = label(u"Label6"_s, m_page.Label6, "strong");
+    grade->setAlignment(Qt::AlignCenter);
+    inside->addWidget(grade);
+    m_turn = button(
+        u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"rotate"_s);
+    inside->addWidget(m_turn, 0, Qt::AlignCenter);
     column->addWidget(card, 1);
 
     m_offer = new QFrame(box);
@@ -179,17 +198,26 @@ QWidget* kyoskNewView::makeSide()
     offer->addWidget(button(u"Command24"_s, m_page.Command24, Role::Plain, [this] { m_page.Command24_Click(); }));
     offer->addWidget(button(u"Command25"_s, m_page.Command25, Role::Plain, [this] { m_page.Command25_Click(); }));
     offer->addWidget(button(u"Command23"_s, m_page.Command23, Role::Quiet, [this] { m_page.Command23_Click(); }));
+    for (const char* name : {"Command24", "Command25", "Command23"})
+        setRole(m_offer->findChild<QWidget*>(QString::fromLatin1(name)), "tall");
     bind(u"Picture66"_s, m_offer, m_page.Picture66);
     column->addWidget(m_offer);
+    column->addWidget(button(
+        u"Image33"_s, m_page.Image33, Role::Plain, [this] { m_page.Image33_Click(); }, u"shop"_s));
     return box;
 }
 
-void kyoskNewView::makeBars()
-{
-    frame().addHeaderAction(button(u"Image6"_s, m_page.Image6, Role::Quiet, [this] { m_page.Image6_Click(); }, u"info"_s));
-    frame().addHeaderAction(button(u"Image10"_s, m_page.Image10, Role::Quiet, [this] { m_page.Image10_Click(); }, u"exit"_s));
-    frame().addSecondaryAction(button(u"Image5"_s, m_page.Image5, Role::Secondary, [this] { m_page.Image5_Click(); }, u"folder-plus"_s));
-    frame().addSecondaryAction(button(u"Image11"_s, m_page.Image11, Role::Quiet, [this] { m_page.Image11_Click(); }, u"tag"_s));
+void kyoskNewView::makeBars() {
+    frame().addHeaderAction(button(
+        u"Image11"_s, m_page.Image11, Role::Quiet, [this] { m_page.Image11_Click(); }, u"tag"_s));
+    frame().addHeaderAction(button(
+        u"Image6"_s, m_page.Image6, Role::Quiet, [this] { m_page.Image6_Click(); }, u"info"_s));
+    frame().addHeaderAction(button(
+        u"Image10"_s, m_page.Image10, Role::Quiet, [this] { m_page.Image10_Click(); }, u"exit"_s));
+    frame().addSecondaryAction(button(
+        u"Image5"_s, m_page.Image5, Role::Secondary, [this] { m_page.Image5_Click(); }, u"folder-plus"_s));
+    frame().addSecondaryAction(button(
+        u"Image8"_s, m_page.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"eraser"_s));
 
     m_total = new QFrame(this);
     auto* total = new QHBoxLayout(m_total);
@@ -213,13 +241,13 @@ void kyoskNewView::makeBars()
     frame().addMainAction(m_finish);
 }
 
-void kyoskNewView::makeLeavePanel()
-{
+void kyoskNewView::makeLeavePanel() {
     m_leave = new Overlay(theme(), this);
     m_leave->column()->addWidget(label(u"Label11"_s, m_page.Label11, "large"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
-    row->addWidget(button(u"Command15"_s, m_page.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"exit"_s));
+    row->addWidget(button(
+        u"Command15"_s, m_page.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"exit"_s));
     row->addStretch(1);
     auto* stay = button(u"Command4"_s, m_page.Command4, Role::Main, [this] { m_page.Command4_Click(); });
     row->addWidget(stay);
@@ -228,8 +256,7 @@ void kyoskNewView::makeLeavePanel()
     connect(m_leave, &Overlay::escaped, this, [this] { m_page.Command4_Click(); });
 }
 
-void kyoskNewView::makeHelpPanel()
-{
+void kyoskNewView::makeHelpPanel() {
     m_help = new Overlay(theme(), this);
     m_help->setCardWidth(700);
     m_help->column()->addWidget(label(u"Label9"_s, m_page.Label9));
@@ -243,17 +270,17 @@ void kyoskNewView::makeHelpPanel()
     connect(m_help, &Overlay::escaped, this, [this] { m_page.Image6_Click(); });
 }
 
-void kyoskNewView::makeClosingPanel()
-{
+void kyoskNewView::makeClosingPanel() {
     m_closing = new Overlay(theme(), this);
-    m_closing->setCardWidth(760);
+    m_closing->setCardWidth(920);
     auto* column = m_closing->column();
     column->setSpacing(theme().px(8));
     auto* top = new QHBoxLayout;
     top->setSpacing(theme().px(12));
     m_closingHead = makeLabel(m_closing, "title");
     top->addWidget(m_closingHead, 1);
-    top->addWidget(button(u"Image17"_s, m_page.Image17, Role::Quiet, [this] { m_page.Image17_Click(); }, u"tag"_s));
+    top->addWidget(button(
+        u"Image17"_s, m_page.Image17, Role::Quiet, [this] { m_page.Image17_Click(); }, u"tag"_s));
     column->addLayout(top);
 
     auto* facts = new QFrame(m_closing);
@@ -277,6 +304,7 @@ void kyoskNewView::makeClosingPanel()
     auto* mailLine = new QHBoxLayout;
     mailLine->addWidget(label(u"Label17"_s, m_page.Label17, "strong"));
     auto* required = label(u"Label33"_s, m_page.Label33, "danger");
+    required->setWordWrap(false);
     mailLine->addWidget(required);
     mailLine->addStretch(1);
     column->addLayout(mailLine);
@@ -297,7 +325,8 @@ void kyoskNewView::makeClosingPanel()
     m_domain->setInsertPolicy(QComboBox::NoInsert);
     m_domain->setProperty("ownRing", true);
     connect(m_domain, &QComboBox::activated, this, [this](int row) { m_page.Combo1_Click(row); });
-    connect(m_domain->lineEdit(), &QLineEdit::textEdited, this, [this](const QString& text) { m_page.Combo1_Change(text); });
+    connect(m_domain->lineEdit(), &QLineEdit::textEdited, this,
+            [this](const QString& text) { m_page.Combo1_Change(text); });
     bind(u"Combo1"_s, m_domain, m_page.Combo1);
     addressRow->addWidget(m_domain, 2);
     m_albumMail = field(u"Txt4Ml2"_s, m_page.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
@@ -325,8 +354,7 @@ void kyoskNewView::makeClosingPanel()
     connect(m_closing, &Overlay::escaped, this, [this] { m_page.Command10_Click(); });
 }
 
-void kyoskNewView::makeBranchPanel()
-{
+void kyoskNewView::makeBranchPanel() {
     m_branches = new Overlay(theme(), this);
     m_branches->setCardWidth(820);
     m_branchHead = label(u"Pic4snifim"_s, m_page.Pic4snifim, "title");
@@ -337,8 +365,9 @@ void kyoskNewView::makeBranchPanel()
     grid->setSpacing(theme().px(8));
     for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
         const int branch = static_cast<int>(i);
-        auto* made = button(u"Command4Snif(%1)"_s.arg(i), m_page.Command4Snif[i], Role::Plain,
-                            [this, branch] { m_page.Command4Snif_Click(branch); }, branch == 10 ? u"truck"_s : u"shop"_s);
+        auto* made = button(
+            u"Command4Snif(%1)"_s.arg(i), m_page.Command4Snif[i], Role::Plain,
+            [this, branch] { m_page.Command4Snif_Click(branch); }, branch == 10 ? u"truck"_s : u"shop"_s);
         m_branchButtons[i] = made;
         grid->addWidget(made, branch / 2, branch % 2);
     }
@@ -351,10 +380,10 @@ void kyoskNewView::makeBranchPanel()
     bind(u"Pic4Snif"_s, card, m_page.Pic4Snif);
     row->addWidget(card, 2);
     m_branches->column()->addLayout(row);
-    m_branches->column()->addWidget(button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
-                                    Qt::AlignLeading);
+    m_branches->column()->addWidget(
+        button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
+        Qt::AlignLeading);
     connect(m_branches, &Overlay::escaped, this, [this] { m_page.Command28_Click(); });
-    frame().addSecondaryAction(button(u"Image33"_s, m_page.Image33, Role::Secondary, [this] { m_page.Image33_Click(); }, u"shop"_s));
     // The card beside the buttons follows the mouse and the keyboard alike.
     connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {
         for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
@@ -366,8 +395,7 @@ void kyoskNewView::makeBranchPanel()
         made->installEventFilter(this);
 }
 
-bool kyoskNewView::eventFilter(QObject* watched, QEvent* event)
-{
+bool kyoskNewView::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() == QEvent::Enter) {
         for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
             if (watched == m_branchButtons[i] && !isDetached())
@@ -377,8 +405,7 @@ bool kyoskNewView::eventFilter(QObject* watched, QEvent* event)
     return PageView::eventFilter(watched, event);
 }
 
-void kyoskNewView::makeCompressionPanel()
-{
+void kyoskNewView::makeCompressionPanel() {
     m_compression = new Overlay(theme(), this);
     m_compression->column()->addWidget(label(u"Label37"_s, m_page.Label37, "large"));
     auto* row = new QHBoxLayout;
@@ -391,15 +418,26 @@ void kyoskNewView::makeCompressionPanel()
     m_compression->setFirstFocus(yes);
 }
 
-void kyoskNewView::bindTheRest()
-{
-    const std::pair<const char*, const Caption*> captions[] = {
-        {"Label1", &m_page.Label1}, {"Label2", &m_page.Label2}, {"Label18", &m_page.Label18}, {"Label24", &m_page.Label24},
-        {"Label34", &m_page.Label34}, {"Label34Prompt", &m_page.Label34Prompt}, {"Label36", &m_page.Label36},
-        {"Frame2", &m_page.Frame2}, {"Frame3", &m_page.Frame3}, {"Frame4", &m_page.Frame4}, {"Picture7", &m_page.Picture7},
-        {"PicB4Sioom", &m_page.PicB4Sioom}, {"Pic4Brose", &m_page.Pic4Brose}, {"Command11", &m_page.Command11},
-        {"Image19", &m_page.Image19}, {"Image20", &m_page.Image20}, {"Image23", &m_page.Image23},
-        {"Command26(0)", &m_page.Command26[0]}, {"Command26(1)", &m_page.Command26[1]}};
+void kyoskNewView::bindTheRest() {
+    const std::pair<const char*, const Caption*> captions[] = {{"Label1", &m_page.Label1},
+                                                               {"Label2", &m_page.Label2},
+                                                               {"Label18", &m_page.Label18},
+                                                               {"Label24", &m_page.Label24},
+                                                               {"Label34", &m_page.Label34},
+                                                               {"Label34Prompt", &m_page.Label34Prompt},
+                                                               {"Label36", &m_page.Label36},
+                                                               {"Frame2", &m_page.Frame2},
+                                                               {"Frame3", &m_page.Frame3},
+                                                               {"Frame4", &m_page.Frame4},
+                                                               {"Picture7", &m_page.Picture7},
+                                                               {"PicB4Sioom", &m_page.PicB4Sioom},
+                                                               {"Pic4Brose", &m_page.Pic4Brose},
+                                                               {"Command11", &m_page.Command11},
+                                                               {"Image19", &m_page.Image19},
+                                                               {"Image20", &m_page.Image20},
+                                                               {"Image23", &m_page.Image23},
+                                                               {"Command26(0)", &m_page.Command26[0]},
+                                                               {"Command26(1)", &m_page.Command26[1]}};
     for (const auto& [name, caption] : captions)
         bindHidden(QString::fromLatin1(name), *caption);
     bindList(u"List1"_s, m_page.List1.lines());
@@ -407,18 +445,15 @@ void kyoskNewView::bindTheRest()
     bindList(u"List4"_s, m_page.List4.paths());
 }
 
-QWidget* kyoskNewView::firstFocus() const
-{
+QWidget* kyoskNewView::firstFocus() const {
     return m_page.List4.isEmpty() ? static_cast<QWidget*>(m_firstFolder) : m_cells[0];
 }
 
-void kyoskNewView::escape()
-{
+void kyoskNewView::escape() {
     m_page.Image10_Click();
 }
 
-void kyoskNewView::keyPressEvent(QKeyEvent* event)
-{
+void kyoskNewView::keyPressEvent(QKeyEvent* event) {
     if (event->key() == Qt::Key_PageDown && m_next->isEnabled() && m_next->isVisible())
         m_next->click();
     else if (event->key() == Qt::Key_PageUp && m_previous->isEnabled() && m_previous->isVisible())
@@ -427,29 +462,17 @@ void kyoskNewView::keyPressEvent(QKeyEvent* event)
         PageView::keyPressEvent(event);
 }
 
-void kyoskNewView::resizeEvent(QResizeEvent* event)
-{
-    PageView::resizeEvent(event);
-    QTimer::singleShot(0, this, &kyoskNewView::fitCells);
-}
-
-void kyoskNewView::showEvent(QShowEvent* event)
-{
-    PageView::showEvent(event);
-    QTimer::singleShot(0, this, &kyoskNewView::fitCells);
-}
-
-void kyoskNewView::fitCells()
-{
+void kyoskNewView::fitCells() {
     if (isDetached() || !isVisible())
         return;
     m_page.setScreenHeight(screen()->size().height());
-    if (m_cells[0]->width() > 40)
+    // A cell that was never shown has no true size yet.
+    if (m_cells[0]->isVisible())
+        m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
         m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
 }
 
-void kyoskNewView::renderCells()
-{
+void kyoskNewView::renderCells() {
     for (std::size_t i = 0; i < cellsOfPage; ++i) {
         const QString path = m_page.List2.item(static_cast<int>(i));
         PictureCell::Look look;
@@ -460,16 +483,18 @@ void kyoskNewView::renderCells()
         look.copies = m_page.Label4[i].text;
         look.name = LeafName(path);
         m_cells[i]->show(look);
-        speak(m_cells[i], !look.filled ? wording(u"תא ריק"_s, u"Empty place"_s)
-                          : look.chosen ? wording(u"%1, נבחרה, עותקים: %2"_s, u"%1, chosen, copies: %2"_s).arg(look.name, look.copies.trimmed())
-                                        : wording(u"%1, לחץ לבחירה"_s, u"%1, press to choose"_s).arg(look.name));
+        speak(
+            m_cells[i],
+            !look.filled ? wording(u"תא ריק"_s, u"Empty place"_s)
+            : look.chosen
+                ? wording(u"%1, נבחרה, עותקים: %2"_s, u"%1, chosen, copies: %2"_s).arg(look.name, look.copies.trimmed())
+                : wording(u"%1, לחץ לבחירה"_s, u"%1, press to choose"_s).arg(look.name));
         speak(m_cells[i]->plus(), wording(u"עותק נוסף של %1"_s, u"One more copy of %1"_s).arg(look.name));
         speak(m_cells[i]->minus(), wording(u"עותק אחד פחות של %1"_s, u"One copy less of %1"_s).arg(look.name));
     }
 }
 
-void kyoskNewView::renderClosing()
-{
+void kyoskNewView::renderClosing() {
     m_closingHead->setText(wording(u"כמעט סיימנו"_s, u"Almost done"_s));
     speak(m_mail, m_page.Label17.text.simplified());
     speak(m_domain, wording(u"ספק הדואר, אחרי השטרודל"_s, u"Mail provider, behind the at sign"_s));
@@ -498,8 +523,7 @@ void kyoskNewView::renderClosing()
     m_closing->setOpen(m_page.Frame4.visible);
 }
 
-void kyoskNewView::takeFocus()
-{
+void kyoskNewView::takeFocus() {
     if (m_focusRequest == m_page.focusRequest)
         return;
     m_focusRequest = m_page.focusRequest;
@@ -507,9 +531,13 @@ void kyoskNewView::takeFocus()
         widget->setFocus(Qt::OtherFocusReason);
 }
 
-void kyoskNewView::render()
-{
-    m_body->setCurrentIndex(m_page.List4.isEmpty() && m_page.List1.isEmpty() ? 0 : 1);
+void kyoskNewView::render() {
+    m_side->setLayoutDirection(layoutDirection());
+    const int body = m_page.List4.isEmpty() && m_page.List1.isEmpty() ? 0 : 1;
+    if (m_body->currentIndex() != body) {
+        m_body->setCurrentIndex(body);
+        QTimer::singleShot(0, this, &kyoskNewView::fitCells);
+    }
     m_emptyHead->setText(wording(u"מאיפה ניקח את התמונות?"_s, u"Where are your pictures?"_s));
     m_emptyText->setText(isolated(m_page.Label25.text));
     m_firstFolder->setText(wording(u"פתח תיקיית תמונות"_s, u"Open a folder of pictures"_s));
@@ -517,18 +545,23 @@ void kyoskNewView::render()
     const QString folder = m_page.Label29.text.trimmed();
     QString line;
     if (!folder.isEmpty())
-        line = QChar(0x2066) + m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(260)) + QChar(0x2069);
+        line = QChar(0x2066) + m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200)) +
+               QChar(0x2069);
     if (!m_page.Label34.text.trimmed().isEmpty() && !folder.isEmpty())
         line += u"  ·  "_s + wording(u"%1 תמונות"_s, u"%1 pictures"_s).arg(m_page.Label34.text.trimmed());
     m_folder->setText(line);
     renderCells();
-    m_large->show(m_page.Picture2, wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s, u"Few pixels: the print may come out blurred"_s));
+    m_large->show(m_page.Picture2, wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s,
+                                           u"Few pixels: the print may come out blurred"_s));
+    m_turn->setVisible(m_page.Image4.visible && !m_page.Picture2.bitmap.isNull());
     setDirectedIcon(m_previous, false);
     setDirectedIcon(m_next, true);
     m_next->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight);
     setDirectedIcon(m_backToPictures, false);
     // One main action at a time.
     m_finishAlbum->setVisible(m_page.Image13.visible && !m_page.Image7.visible);
+    for (const char* name : {"Command24", "Command25", "Command23"})
+        breakLong(*findChild<QPushButton*>(QString::fromLatin1(name)));
     m_helpClose->setText(wording(u"סגור"_s, u"Close"_s));
     m_helpClose->setAccessibleName(m_helpClose->text());
     m_leave->setOpen(m_page.Frame3.visible);

@@ -22,8 +22,6 @@ public:
 protected:
     void render() override;
     void keyPressEvent(QKeyEvent* event) override;
-    void resizeEvent(QResizeEvent* event) override;
-    void showEvent(QShowEvent* event) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
@@ -47,10 +45,12 @@ private:
     QStackedLayout* m_body = nullptr;
     std::array<PictureCell*, cellsOfPage> m_cells{};
     LargePicture* m_large = nullptr;
+    QWidget* m_side = nullptr;
     QFrame* m_offer = nullptr;
     QLabel* m_folder = nullptr;
     QLabel* m_emptyHead = nullptr;
     QLabel* m_emptyText = nullptr;
+    QPushButton* m_turn = nullptr;
     QPushButton* m_firstFolder = nullptr;
     QPushButton* m_previous = nullptr;
     QPushButton* m_next = nullptr;

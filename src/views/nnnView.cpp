@@ -22,8 +22,7 @@ using namespace Qt::StringLiterals;
 
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page)
-{
+    , m_page(page) {
     frame().steps().setStep(OrderStep::Details);
     auto* content = new QWidget(this);
     m_steps = new QStackedLayout(content);
@@ -46,8 +45,7 @@ nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     start();
 }
 
-QWidget* nnnView::makeMenu()
-{
+QWidget* nnnView::makeMenu() {
     auto* menu = new QWidget(this);
     m_tileGrid = new QGridLayout(menu);
     m_tileGrid->setContentsMargins(0, 0, 0, 0);
@@ -65,8 +63,7 @@ QWidget* nnnView::makeMenu()
     return menu;
 }
 
-void nnnView::placeTiles()
-{
+void nnnView::placeTiles() {
     QList<int> wanted;
     for (int i = 0; i < 10; ++i) {
         if (m_tiles[static_cast<std::size_t>(i)] && m_page.Image1[static_cast<std::size_t>(i)].visible)
@@ -84,20 +81,19 @@ void nnnView::placeTiles()
         m_tileGrid->addWidget(m_tiles[static_cast<std::size_t>(wanted[i])], i / columns, i % columns);
 }
 
-QWidget* nnnView::makeDetails()
-{
+QWidget* nnnView::makeDetails() {
     auto* step = new QWidget(this);
     auto* outer = new QHBoxLayout(step);
     outer->setContentsMargins(0, 0, 0, 0);
     outer->addStretch(1);
     auto* card = new QFrame(step);
     setRole(card, "card");
-    card->setMinimumWidth(theme().px(640));
+    card->setMinimumWidth(theme().px(720));
     auto* form = new QVBoxLayout(card);
     form->setContentsMargins(theme().px(32), theme().px(24), theme().px(32), theme().px(24));
     form->setSpacing(theme().px(6));
-    const auto line = [&](const QString& name, const Caption& caption, const QString& labelName, const Caption& labelCaption,
-                          void (nnn::*changed)(const QString&)) {
+    const auto line = [&](const QString& name, const Caption& caption, const QString& labelName,
+                          const Caption& labelCaption, void (nnn::*changed)(const QString&)) {
         auto* title = label(labelName, labelCaption, "strong");
         form->addWidget(title);
         auto* box = field(name, caption, [this, changed](const QString& text) { (m_page.*changed)(text); });
@@ -114,7 +110,8 @@ QWidget* nnnView::makeDetails()
     auto* row = new QHBoxLayout;
     row->addWidget(checkBox(u"Check2"_s, m_page.Check2, [this](bool on) { m_page.Check2_Click(on); }));
     row->addStretch(1);
-    row->addWidget(button(u"Command10"_s, m_page.Command10, Role::Plain, [this] { m_page.Command10_Click(); }, u"memory"_s));
+    row->addWidget(button(
+        u"Command10"_s, m_page.Command10, Role::Plain, [this] { m_page.Command10_Click(); }, u"memory"_s));
     form->addLayout(row);
     auto* centred = new QVBoxLayout;
     centred->addWidget(card);
@@ -124,8 +121,7 @@ QWidget* nnnView::makeDetails()
     return step;
 }
 
-QWidget* nnnView::makeOptions()
-{
+QWidget* nnnView::makeOptions() {
     auto* step = new QWidget(this);
     auto* column = new QVBoxLayout(step);
     column->setContentsMargins(0, 0, 0, 0);
@@ -136,12 +132,14 @@ QWidget* nnnView::makeOptions()
     for (std::size_t i = 0; i < m_page.Option1.size(); ++i) {
         auto* card = new PaperCard(theme(), this);
         card->setCardSize(190, 200);
-        bindChoice(u"Option1(%1)"_s.arg(i), card, m_page.Option1[i], [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
+        bindChoice(u"Option1(%1)"_s.arg(i), card, m_page.Option1[i],
+                   [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
         sizes->addWidget(card, 2);
     }
     auto* more = new QVBoxLayout;
     more->addStretch(1);
-    m_moreSizes = comboBox(u"Combo1"_s, m_page.Combo1List, m_page.Combo1, [this](int row) { m_page.Combo1_Click(row); });
+    m_moreSizes =
+        comboBox(u"Combo1"_s, m_page.Combo1List, m_page.Combo1, [this](int row) { m_page.Combo1_Click(row); });
     m_moreSizes->setMinimumWidth(theme().px(220));
     more->addWidget(m_moreSizes);
     m_coupon = label(u"Label4kpn"_s, m_page.Label4kpn, "muted");
@@ -154,9 +152,11 @@ QWidget* nnnView::makeOptions()
     auto* kinds = new QHBoxLayout;
     kinds->setSpacing(theme().px(16));
     for (std::size_t i = 0; i < m_page.Option3.size(); ++i) {
-        auto* card = new DrawingCard(theme(), this, i == 0 ? DrawingCard::Drawing::Matte : DrawingCard::Drawing::Glossy);
+        auto* card =
+            new DrawingCard(theme(), this, i == 0 ? DrawingCard::Drawing::Matte : DrawingCard::Drawing::Glossy);
         card->setCardSize(260, 165);
-        bindChoice(u"Option3(%1)"_s.arg(i), card, m_page.Option3[i], [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
+        bindChoice(u"Option3(%1)"_s.arg(i), card, m_page.Option3[i],
+                   [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
         kinds->addWidget(card, 2);
     }
     kinds->addStretch(2);
@@ -165,8 +165,7 @@ QWidget* nnnView::makeOptions()
     return step;
 }
 
-QWidget* nnnView::makeBorders()
-{
+QWidget* nnnView::makeBorders() {
     auto* step = new QWidget(this);
     auto* row = new QHBoxLayout(step);
     row->setContentsMargins(0, 0, 0, 0);
@@ -196,8 +195,7 @@ QWidget* nnnView::makeBorders()
     return step;
 }
 
-QWidget* nnnView::makeFit()
-{
+QWidget* nnnView::makeFit() {
     auto* step = new QWidget(this);
     auto* row = new QHBoxLayout(step);
     row->setContentsMargins(0, 0, 0, 0);
@@ -216,8 +214,7 @@ QWidget* nnnView::makeFit()
     return step;
 }
 
-QWidget* nnnView::makeTerms()
-{
+QWidget* nnnView::makeTerms() {
     auto* step = new QWidget(this);
     auto* outer = new QHBoxLayout(step);
     outer->setContentsMargins(0, 0, 0, 0);
@@ -244,14 +241,16 @@ QWidget* nnnView::makeTerms()
     auto* row = new QHBoxLayout;
     row->addWidget(checkBox(u"Check1"_s, m_page.Check1, [this](bool on) { m_page.Check1_Click(on); }));
     row->addStretch(1);
-    row->addWidget(button(u"Command29"_s, m_page.Command29, Role::Plain, [this] { m_page.Command29_Click(); }, u"document"_s));
+    row->addWidget(button(
+        u"Command29"_s, m_page.Command29, Role::Plain, [this] { m_page.Command29_Click(); }, u"document"_s));
     termsColumn->addLayout(row);
     m_hint = new QFrame(terms);
     setRole(m_hint, "notice");
     auto* hintRow = new QHBoxLayout(m_hint);
     hintRow->setContentsMargins(theme().px(16), theme().px(10), theme().px(16), theme().px(10));
     hintRow->addWidget(label(u"LabelTerms"_s, m_page.LabelTerms), 1);
-    hintRow->addWidget(button(u"Command30"_s, m_page.Command30, Role::Quiet, [this] { m_page.Command30_Click(); }, u"close"_s));
+    hintRow->addWidget(button(
+        u"Command30"_s, m_page.Command30, Role::Quiet, [this] { m_page.Command30_Click(); }, u"close"_s));
     termsColumn->addWidget(m_hint);
     column->addWidget(terms);
     column->addStretch(1);
@@ -260,18 +259,21 @@ QWidget* nnnView::makeTerms()
     return step;
 }
 
-void nnnView::makeBars()
-{
-    frame().addHeaderAction(
-        button(u"Image1(8)"_s, m_page.Image1[EnglishTile], Role::Quiet, [this] { m_page.Image1_Click(EnglishTile); }, u"globe"_s));
-    frame().addHeaderAction(
-        button(u"Image1(5)"_s, m_page.Image1[ExitTile], Role::Quiet, [this] { m_page.Image1_Click(ExitTile); }, u"exit"_s));
+void nnnView::makeBars() {
+    frame().addHeaderAction(button(
+        u"Image1(8)"_s, m_page.Image1[EnglishTile], Role::Quiet, [this] { m_page.Image1_Click(EnglishTile); },
+        u"globe"_s));
+    frame().addHeaderAction(button(
+        u"Image1(5)"_s, m_page.Image1[ExitTile], Role::Quiet, [this] { m_page.Image1_Click(ExitTile); }, u"exit"_s));
 
     m_back = button(u"Command4"_s, m_page.Command4, Role::Secondary, [this] { m_page.Command4_Click(); });
     frame().addSecondaryAction(m_back);
-    frame().addSecondaryAction(button(u"Command2"_s, m_page.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }));
-    frame().addSecondaryAction(button(u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"info"_s));
-    frame().addSecondaryAction(button(u"Command14"_s, m_page.Command14, Role::Secondary, [this] { m_page.Command14_Click(); }, u"eraser"_s));
+    frame().addSecondaryAction(
+        button(u"Command2"_s, m_page.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }));
+    frame().addSecondaryAction(button(
+        u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"info"_s));
+    frame().addSecondaryAction(button(
+        u"Command14"_s, m_page.Command14, Role::Secondary, [this] { m_page.Command14_Click(); }, u"eraser"_s));
     m_choiceStatus = label(u"Choice"_s, m_page.Choice, "strong");
     m_choiceStatus->setWordWrap(false);
     frame().addStatus(m_choiceStatus);
@@ -302,11 +304,11 @@ void nnnView::makeBars()
     connect(m_clean, &Overlay::escaped, this, [this] { m_page.Command9_Click(); });
 }
 
-QWidget* nnnView::firstFocus() const
-{
+QWidget* nnnView::firstFocus() const {
     switch (m_page.step) {
     case nnn::Step::Menu:
-        return m_placed.isEmpty() ? nullptr : static_cast<QWidget*>(m_tiles[static_cast<std::size_t>(m_placed.first())]);
+        return m_placed.isEmpty() ? nullptr
+                                  : static_cast<QWidget*>(m_tiles[static_cast<std::size_t>(m_placed.first())]);
     case nnn::Step::Details:
         return m_name;
     case nnn::Step::Options:
@@ -321,14 +323,12 @@ QWidget* nnnView::firstFocus() const
     return nullptr;
 }
 
-void nnnView::escape()
-{
+void nnnView::escape() {
     if (m_page.Command4.visible && m_page.Command4.enabled)
         m_page.Command4_Click();
 }
 
-void nnnView::render()
-{
+void nnnView::render() {
     frame().setTitle(m_page.Title.text, m_page.StepLine.visible ? m_page.StepLine.text : QString());
     for (std::size_t i = 0; i < m_tiles.size(); ++i) {
         if (!m_tiles[i])

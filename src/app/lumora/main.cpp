@@ -8,21 +8,26 @@
 
 using namespace lumora;
 
-int main(int argc, char** argv)
-{
+int main(int argc, char** argv) {
     Application application(argc, argv);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
     QCommandLineParser parser;
     parser.setApplicationDescription(QStringLiteral("Orders prints from a photo lab."));
-    const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Show this help and end."));
-    const QCommandLineOption version({QStringLiteral("v"), QStringLiteral("version")}, QStringLiteral("Show the version and end."));
-    const QCommandLineOption lab(QStringLiteral("lab"), QStringLiteral("Read the lab's settings from FILE."), QStringLiteral("FILE"));
-    const QCommandLineOption window(QStringLiteral("window"), QStringLiteral("Run in a window, not over the whole screen."));
+    const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")},
+                                  QStringLiteral("Show this help and end."));
+    const QCommandLineOption version({QStringLiteral("v"), QStringLiteral("version")},
+                                     QStringLiteral("Show the version and end."));
+    const QCommandLineOption lab(QStringLiteral("lab"), QStringLiteral("Read the lab's settings from FILE."),
+                                 QStringLiteral("FILE"));
+    const QCommandLineOption window(QStringLiteral("window"),
+                                    QStringLiteral("Run in a window, not over the whole screen."));
     parser.addOptions({help, version, lab, window});
     if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
-        std::fprintf(stderr, "lumora: %s\n", qPrintable(parser.errorText().isEmpty()
-                                                            ? QStringLiteral("unexpected argument '%1'").arg(parser.positionalArguments().first())
-                                                            : parser.errorText()));
+        std::fprintf(
+            stderr, "lumora: %s\n",
+            qPrintable(parser.errorText().isEmpty()
+                           ? QStringLiteral("unexpected argument '%1'").arg(parser.positionalArguments().first())
+                           : parser.errorText()));
         return 2;
     }
     if (parser.isSet(help)) {

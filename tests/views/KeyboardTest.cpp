@@ -1,0 +1,163 @@
+#include "Walk.h"
+
+#include "entry/nnn.h"
+#include "selection/kyoskNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "transfer/FtpFrm.h"
+#include "views/MainWindow.h"
+#include "views/ScreenDialogs.h"
+
+#include <QApplication>
+#include <QTest>
+#include <QTimer>
+#include <QWidget>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QString focusName() {
+    return QApplication::focusWidget() ? QApplication::focusWidget()->objectName() : QString();
+}
+
+void key(Walk& walk, Qt::Key code) {
+    QWidget* target = QApplication::focusWidget();
+    QTest::keyClick(target ? target : static_cast<QWidget*>(&walk.program().window()), code);
+    walk.settle();
+}
+
+void text(const QString& words) {
+    QTest::keyClicks(QApplication::focusWidget(), words);
+}
+
+// Tab until the control has the keyboard; going round without finding it is a failure.
+void tabTo(Walk& walk, const QString& name) {
+    for (int i = 0; i < 80 && focusName() != name; ++i)
+        key(walk, Qt::Key_Tab);
+    ASSERT_EQ(focusName(), name);
+}
+
+} // namespace
+
+TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
+    Walk walk({1024, 768});
+    walk.program().window().activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
+    tabTo(walk, u"Image1"_s);
+    key(walk, Qt::Key_Space);
+    walk.waitFor(u"nnn"_s);
+    tabTo(walk, u"Image1(0)"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_EQ(focusName(), u"Text2"_s) << "the first box has the keyboard";
+    text(u"Dana Levi"_s);
+    key(walk, Qt::Key_Tab);
+    text(u"03-1234567"_s);
+    key(walk, Qt::Key_Return); // the main action
+    tabTo(walk, u"Option1(0)"_s);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Option3(1)"_s);
+    key(walk, Qt::Key_Return);
+    tabTo(walk, u"Image13(9)"_s);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Command6"_s);
+    key(walk, Qt::Key_Return);
+    tabTo(walk, u"Check1"_s);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Command3"_s);
+    key(walk, Qt::Key_Return);
+    walk.waitFor(u"kyoskNew"_s);
+
+    // The picker runs an event loop of its own below the press.
+    bool picked = false;
+    QTimer::singleShot(300, &walk.program().window(), [&] {
+        EXPECT_EQ(focusName(), u"pickerGrid"_s);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Right);
+        picked = true;
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+    });
+    tabTo(walk, u"firstFolder"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_TRUE(picked);
+    walk.settle(300);
+    auto& pictures = walk.page<kyoskNew>(PageId::kyoskNew);
+    ASSERT_EQ(pictures.List4.count(), 14);
+    tabTo(walk, u"Picture1(0)"_s);
+    key(walk, Qt::Key_Space);
+    key(walk, Qt::Key_Down);
+    key(walk, Qt::Key_Right);
+    ASSERT_EQ(focusName(), u"Picture1(5)"_s);
+    key(walk, Qt::Key_Return);
+    key(walk, Qt::Key_Plus);
+    EXPECT_EQ(pictures.Label7.text.trimmed(), u"3"_s);
+    EXPECT_EQ(pictures.List1.count(), 2);
+    tabTo(walk, u"Image10"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_TRUE(pictures.Frame3.visible);
+    key(walk, Qt::Key_Escape);
+    EXPECT_FALSE(pictures.Frame3.visible) << "Esc closes the panel";
+    tabTo(walk, u"Image7"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_TRUE(pictures.Frame4.visible);
+    tabTo(walk, u"Command7"_s);
+    key(walk, Qt::Key_Return);
+    walk.waitFor(u"FtpFrm"_s);
+    EXPECT_EQ(walk.program().state().shemot.n1, u"Dana Levi"_s);
+    EXPECT_EQ(walk.program().state().shemot.Bord, u"WB"_s);
+}
+
+TEST(Language, TurnsOverOnEachPageAndBack) {
+    Walk walk({1024, 768});
+    const auto flip = [&](PageId id) {
+        auto& page = walk.page<Page>(id);
+        for (const std::int16_t english : {1, 0}) {
+            walk.program().state().EnglishTips = english;
+            page.setTexts();
+            Q_EMIT page.changed();
+            walk.settle(60);
+            const QWidget* view = walk.program().window().findChild<QWidget*>(pageName(id));
+            EXPECT_EQ(view->layoutDirection(), english == 1 ? Qt::LeftToRight : Qt::RightToLeft)
+                << qPrintable(pageName(id));
+            for (const QString& fault : walk.faults(english == 1))
+                ADD_FAILURE() << qPrintable(pageName(id)) << ": " << qPrintable(fault);
+        }
+    };
+    flip(PageId::hatchala);
+    walk.toDetails(false);
+    flip(PageId::nnn);
+    walk.toOptions();
+    flip(PageId::nnn);
+    // From here on the paper's kind is data, in the words in which it was chosen.
+    walk.toBorder();
+    walk.toTerms();
+    walk.toPictures();
+    walk.choosePictures();
+    flip(PageId::kyoskNew);
+    walk.toClosing();
+    flip(PageId::kyoskNew);
+}
+
+TEST(Presses, FailOnWhatAPersonCouldNotPress) {
+    Walk walk({1024, 768});
+    const ControlFinder finder(walk.program().window());
+    EXPECT_FALSE(finder.press(u"nnn"_s, u"Command12"_s).ok()) << "another page is in front";
+    EXPECT_FALSE(finder.press(u"hatchala"_s, u"Picture8"_s).ok()) << "hidden";
+    EXPECT_FALSE(finder.press(u"hatchala"_s, u"NoSuchControl"_s).ok());
+    walk.program().dialogs().message(u"First"_s);
+    walk.program().dialogs().message(u"Second"_s);
+    walk.settle();
+    const Result<void> covered = finder.press(u"hatchala"_s, u"Image11"_s);
+    ASSERT_FALSE(covered.ok());
+    EXPECT_TRUE(covered.failure().message.contains(u"covered"_s)) << qPrintable(covered.failure().message);
+    EXPECT_EQ(walk.program().dialogs().frontText(), u"First"_s);
+    walk.program().dialogs().closeMessages();
+    walk.settle();
+    EXPECT_TRUE(finder.press(u"hatchala"_s, u"Image1"_s).ok());
+    EXPECT_EQ(walk.program().dialogs().shownTexts, (QStringList{u"First"_s, u"Second"_s}));
+}
+
+} // namespace lumora

@@ -1,0 +1,184 @@
+#include "Walk.h"
+
+#include "entry/nnn.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "transfer/FtpFrm.h"
+#include "views/MainWindow.h"
+#include "views/Overlay.h"
+#include "views/ScreenDialogs.h"
+
+#include <gtest/gtest.h>
+
+#include <QTimer>
+#include <QWidget>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+struct Screen {
+    QSize size;
+    bool english;
+};
+
+void PrintTo(const Screen& screen, std::ostream* out) {
+    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
+}
+
+// Each page in each state: looked at for what a person could stumble over, and photographed where LUMORA_SHOTS asks for
+// it.
+class PageLook : public ::testing::TestWithParam<Screen> {
+protected:
+    void look(Walk& walk, const QString& name) {
+        walk.settle(60);
+        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
+        for (const QString& fault : walk.faults(GetParam().english))
+            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
+    }
+    void changed(Page& page, Walk& walk) {
+        Q_EMIT page.changed();
+        walk.settle(40);
+    }
+};
+
+} // namespace
+
+TEST_P(PageLook, FromTheStartToTheTerms) {
+    Walk walk(GetParam().size);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    look(walk, u"01-start"_s);
+    walk.press(u"hatchala"_s, u"Image1"_s);
+    walk.waitFor(u"nnn"_s);
+    look(walk, u"02-menu"_s);
+    if (walk.pressable(u"nnn"_s, u"Command14"_s)) {
+        walk.press(u"nnn"_s, u"Command14"_s);
+        look(walk, u"03-clean"_s);
+        walk.press(u"nnn"_s, u"Command9"_s);
+    }
+    walk.press(u"nnn"_s, u"Command15"_s);
+    walk.waitFor(u"Havharot"_s);
+    look(walk, u"04-notice"_s);
+    walk.press(u"Havharot"_s, u"Command1"_s);
+    walk.waitFor(u"nnn"_s);
+    walk.press(u"nnn"_s, u"Image1(0)"_s);
+    look(walk, u"05-details"_s);
+    walk.press(u"nnn"_s, u"Command10"_s);
+    look(walk, u"06-message"_s);
+    walk.program().dialogs().closeMessages();
+    walk.toOptions();
+    look(walk, u"07-options"_s);
+    walk.toBorder();
+    look(walk, u"08-border"_s);
+    walk.toTerms();
+    look(walk, u"09-terms"_s);
+}
+
+TEST_P(PageLook, FromThePicturesToTheSending) {
+    Walk walk(GetParam().size, u"[Switches]\nCoupon = no\n"_s);
+    walk.toDetails(GetParam().english);
+    walk.toOptions();
+    walk.toBorder();
+    walk.toTerms();
+    walk.toPictures();
+    look(walk, u"10-no-pictures"_s);
+    // The picker waits in an event loop of its own: it is looked at from within.
+    QTimer::singleShot(400, &walk.program().window(), [&] {
+        look(walk, u"11-picker"_s);
+        QWidget* cancel = walk.program().window().findChild<QWidget*>(u"pickerCancel"_s);
+        ASSERT_TRUE(cancel);
+        EXPECT_EQ(ControlFinder::whyNotPressable(*cancel), QString());
+        QMetaObject::invokeMethod(cancel, "click");
+    });
+    walk.press(u"kyoskNew"_s, u"Image5"_s);
+    walk.choosePictures();
+    look(walk, u"12-pictures"_s);
+    walk.press(u"kyoskNew"_s, u"Image6"_s);
+    look(walk, u"13-help"_s);
+    walk.press(u"kyoskNew"_s, u"helpClose"_s);
+    walk.press(u"kyoskNew"_s, u"Image10"_s);
+    look(walk, u"14-leave"_s);
+    walk.press(u"kyoskNew"_s, u"Command4"_s);
+    walk.toClosing();
+    look(walk, u"15-closing"_s);
+    walk.press(u"kyoskNew"_s, u"Command7"_s);
+    walk.waitFor(u"FtpFrm"_s);
+    walk.settle(200);
+    look(walk, u"17-countdown"_s);
+
+    auto& page = walk.page<FtpFrm>(PageId::FtpFrm);
+    page.Timer1.stop();
+    page.sending = true;
+    page.percent = 42;
+    page.Label3.text = walk.program().state().wording(u"  כעת מעלה לשרת "_s, u"  Now uploading "_s);
+    page.Label4File.text =
+        walk.program().state().wording(u"קובץ 3 מתוך 6: IMG_0003.jpg"_s, u"File 3 of 6: IMG_0003.jpg"_s);
+    page.Label34.text = walk.program().state().wording(u"נסיון שני לקבצים שלא עלו"_s,
+                                                       u"Second attempt for the files that did not go up"_s);
+    page.Command15.enabled = true;
+    changed(page, walk);
+    look(walk, u"18-sending"_s);
+    page.sending = false;
+    page.Label34.text.clear();
+    page.Label4File.text.clear();
+    page.Picture6.visible = page.Label2.visible = page.Label9.visible = page.Command10.visible =
+        page.Command28.visible = true;
+    page.Label4Missing.text = u"3"_s;
+    page.Label12.text = u"6"_s;
+    page.Label2.text = walk.program().state().wording(u"השרת לא ענה"_s, u"The server did not answer"_s);
+    page.Label3.text = walk.program().state().wording(u"לא כל הקבצים הועלו"_s, u"Not all the files were uploaded"_s);
+    changed(page, walk);
+    look(walk, u"19-failed"_s);
+    page.Picture7.visible = true;
+    changed(page, walk);
+    look(walk, u"20-leave-sending"_s);
+    page.Picture7.visible = page.Picture6.visible = page.Label2.visible = page.Label9.visible = page.Command10.visible =
+        false;
+    page.AllDone = 1;
+    page.Picture2.visible = true;
+    page.Image4.visible = page.Image5.visible = false;
+    page.Command11.enabled = true;
+    page.Label3.text =
+        walk.program().state().wording(u"הקבצים הועלו בהצלחה"_s, u"The files were uploaded successfully"_s);
+    changed(page, walk);
+    look(walk, u"21-sent"_s);
+    page.AllDone = 0;
+    page.Frame2.visible = true;
+    changed(page, walk);
+    look(walk, u"22-for-the-lab"_s);
+}
+
+TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
+    QString settings = u"[Switches]\nCoupon = yes\nDeepCompression = ask\n"_s;
+    Walk walk(GetParam().size, settings);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    walk.press(u"hatchala"_s, u"Image1"_s);
+    walk.waitFor(u"nnn"_s);
+    walk.press(u"nnn"_s, u"Image1(2)"_s);
+    walk.toOptions();
+    const auto& sizes = walk.page<nnn>(PageId::nnn).Combo1List;
+    ASSERT_TRUE(
+        ControlFinder(walk.program().window()).choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex())).ok());
+    walk.press(u"nnn"_s, u"Option3(0)"_s);
+    walk.toTerms();
+    walk.toPictures();
+    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    walk.press(u"kyoskNew"_s, u"Image5"_s);
+    walk.settle(300);
+    look(walk, u"23-whole-folder"_s);
+    walk.press(u"kyoskNew"_s, u"Command24"_s);
+    walk.program().state().coupon.MisparKoopon = 14;
+    walk.program().state().coupon.HaKoopon = 1;
+    walk.press(u"kyoskNew"_s, u"Image7"_s);
+    look(walk, u"24-panel-in-front"_s);
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, PageLook,
+                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
+                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+
+} // namespace lumora

@@ -1,0 +1,268 @@
+#include "Walk.h"
+
+#include "imaging/PictureFile.h"
+#include "platform/Files.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/SamplePhotographs.h"
+#include "views/MainWindow.h"
+#include "views/Overlay.h"
+#include "views/PageView.h"
+#include "views/ScreenDialogs.h"
+
+#include <QAbstractButton>
+#include <QAbstractScrollArea>
+#include <QAccessible>
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// No order of a test may leave the machine: nobody listens at this port.
+constexpr const char* labText = "[Server]\nHost = 127.0.0.1:9\nUser = u\nPassword = p\n[Lab]\nPhone = 03-1234567\n"
+                                "Mail = lab@example.com\n";
+
+bool hasHebrew(const QString& text) {
+    return std::any_of(text.begin(), text.end(),
+                       [](QChar c) { return c.unicode() >= 0x0590 && c.unicode() <= 0x05FF; });
+}
+
+QString nameOf(const QWidget& widget) {
+    return u"%1 \"%2\""_s.arg(QString::fromLatin1(widget.metaObject()->className()), widget.objectName());
+}
+
+void unnamed(QAccessibleInterface* node, QStringList& faults) {
+    if (!node || !node->isValid() || node->state().invisible)
+        return;
+    switch (node->role()) {
+    case QAccessible::Button:
+    case QAccessible::CheckBox:
+    case QAccessible::RadioButton:
+    case QAccessible::EditableText:
+    case QAccessible::ComboBox:
+    case QAccessible::List:
+        if (node->text(QAccessible::Name).trimmed().isEmpty() && node->object() &&
+            node->object()->objectName() != u"qt_scrollarea_viewport"_s)
+            faults += u"no accessible name: %1 \"%2\""_s.arg(
+                QString::fromLatin1(node->object()->metaObject()->className()), node->object()->objectName());
+        break;
+    default:
+        break;
+    }
+    if (node->role() == QAccessible::ComboBox)
+        return; // its rows are a window of their own
+    for (int i = 0; i < node->childCount(); ++i)
+        unnamed(node->child(i), faults);
+}
+
+bool insideScroller(const QWidget& widget) {
+    for (const QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
+        if (qobject_cast<const QAbstractScrollArea*>(parent))
+            return true;
+    }
+    return false;
+}
+
+QString clippedText(const QWidget& widget) {
+    if (const auto* label = qobject_cast<const QLabel*>(&widget)) {
+        if (label->text().isEmpty() || !label->pixmap().isNull())
+            return {};
+        const QSize needed =
+            label->wordWrap()
+                ? QSize(label->fontMetrics()
+                            .boundingRect(QRect(0, 0, label->width(), 10000), Qt::TextWordWrap, label->text())
+                            .width(),
+                        label->heightForWidth(label->width()))
+                : label->sizeHint();
+        if (needed.width() > label->width() + 1 || needed.height() > label->height() + 1)
+            return u"text \"%1\" needs %2x%3 and has %4x%5"_s.arg(label->text())
+                .arg(needed.width())
+                .arg(needed.height())
+                .arg(label->width())
+                .arg(label->height());
+    } else if (qobject_cast<const QPushButton*>(&widget) || widget.inherits("QCheckBox")) {
+        if (widget.sizeHint().width() > widget.width() + 1)
+            return u"needs %1 and is %2 wide"_s.arg(widget.sizeHint().width()).arg(widget.width());
+    }
+    return {};
+}
+
+} // namespace
+
+Walk::Walk(QSize size, const QString& labSettings) {
+    const HostPath root(m_folder.path().toStdString());
+    std::filesystem::create_directories(root / "Pictures");
+    QFile lab(m_folder.filePath(u"lab.ini"_s));
+    EXPECT_TRUE(lab.open(QIODevice::WriteOnly));
+    lab.write(labText + labSettings.toUtf8());
+    lab.close();
+    lab.setPermissions(QFile::ReadOwner | QFile::WriteOwner);
+    qputenv("HOME", m_folder.path().toLocal8Bit()); // the picker's places
+    ProgramOptions options;
+    options.labFile = toHostPath(lab.fileName());
+    options.dataFolder = root / "drive_c";
+    options.windowSize = size;
+    m_program = std::make_unique<Program>(std::move(options));
+    const Result<void> started = m_program->start();
+    EXPECT_TRUE(started.ok()) << (started ? "" : qPrintable(started.failure().message));
+    EXPECT_TRUE(writeSamplePhotographs(root / "Pictures", 14, 1.2).ok());
+    settle(60);
+}
+
+Walk::~Walk() = default;
+
+QString Walk::pictureFolder() const {
+    return m_program->platform().files.drives().toDrive(HostPath(m_folder.path().toStdString()) / "Pictures");
+}
+
+Page* Walk::find(PageId id) {
+    return m_program->chain().find(id);
+}
+
+void Walk::settle(int milliseconds) {
+    QTest::qWait(milliseconds);
+}
+
+void Walk::press(const QString& page, const QString& control) {
+    const Result<void> done = ControlFinder(m_program->window()).press(page, control);
+    EXPECT_TRUE(done.ok()) << (done ? "" : qPrintable(done.failure().message));
+    settle();
+}
+
+bool Walk::pressable(const QString& page, const QString& control) {
+    const ControlFinder finder(m_program->window());
+    return finder.visible(page, control).ok() && *finder.visible(page, control);
+}
+
+void Walk::type(const QString& page, const QString& control, const QString& text) {
+    const Result<void> done = ControlFinder(m_program->window()).type(page, control, text);
+    EXPECT_TRUE(done.ok()) << (done ? "" : qPrintable(done.failure().message));
+    settle();
+}
+
+void Walk::waitFor(const QString& page) {
+    const ControlFinder finder(m_program->window());
+    EXPECT_TRUE(QTest::qWaitFor([&] { return finder.frontPage() == page; }, 20000))
+        << "in front: " << qPrintable(finder.frontPage()) << ", wanted: " << qPrintable(page)
+        << ", boxes: " << qPrintable(m_program->dialogs().shownTexts.join(u" | "_s));
+    settle();
+}
+
+void Walk::toDetails(bool english) {
+    if (english)
+        press(u"hatchala"_s, u"Check1"_s);
+    press(u"hatchala"_s, u"Image1"_s);
+    waitFor(u"nnn"_s);
+    press(u"nnn"_s, u"Image1(0)"_s);
+}
+
+void Walk::toOptions() {
+    type(u"nnn"_s, u"Text2"_s, u"Dana Levi"_s);
+    type(u"nnn"_s, u"Text3"_s, u"03-1234567"_s);
+    press(u"nnn"_s, u"Command12"_s);
+}
+
+void Walk::toBorder() {
+    press(u"nnn"_s, u"Option1(0)"_s);
+    press(u"nnn"_s, u"Option3(1)"_s);
+}
+
+void Walk::toTerms() {
+    press(u"nnn"_s, u"Image13(0)"_s);
+    press(u"nnn"_s, u"Command6"_s);
+}
+
+void Walk::toPictures() {
+    press(u"nnn"_s, u"Check1"_s);
+    press(u"nnn"_s, u"Command3"_s);
+    waitFor(u"kyoskNew"_s);
+}
+
+void Walk::choosePictures() {
+    m_program->dialogs().nextPick = [this] { return pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    press(u"kyoskNew"_s, u"Image5"_s);
+    m_program->dialogs().nextPick = {};
+    settle(300);
+    for (const int cell : {0, 1, 4})
+        press(u"kyoskNew"_s, u"Picture1(%1)"_s.arg(cell));
+    press(u"kyoskNew"_s, u"Command12(1)"_s);
+}
+
+void Walk::toClosing() {
+    press(u"kyoskNew"_s, u"Image7"_s);
+}
+
+void Walk::shot(const QString& name) {
+    settle();
+    const QString folder = qEnvironmentVariable("LUMORA_SHOTS");
+    if (folder.isEmpty())
+        return;
+    const QSize size = m_program->window().size();
+    EXPECT_TRUE(
+        m_program->window().grab().save(u"%1/%2-%3x%4.png"_s.arg(folder, name).arg(size.width()).arg(size.height())));
+}
+
+QStringList Walk::faults(bool english) {
+    QStringList result;
+    MainWindow& window = m_program->window();
+    unnamed(QAccessible::queryAccessibleInterface(&window), result);
+    const Overlay* panel = frontOverlay(window);
+    const QWidget* root = panel ? static_cast<const QWidget*>(panel) : window.frontView();
+    for (const QWidget* widget : root->findChildren<QWidget*>()) {
+        if (!widget->isVisible() || widget->size().isEmpty())
+            continue;
+        const auto* button = qobject_cast<const QAbstractButton*>(widget);
+        const bool control =
+            button ||
+            (qobject_cast<const QLineEdit*>(widget) && !qobject_cast<const QComboBox*>(widget->parentWidget())) ||
+            qobject_cast<const QComboBox*>(widget);
+        const bool foreign =
+            insideScroller(*widget) || (widget->parentWidget() && widget->parentWidget()->inherits("QComboBox"));
+        if (control && !foreign) {
+            if (widget->objectName().isEmpty())
+                result += u"no object name: "_s + nameOf(*widget);
+            if (widget->width() < 44 || widget->height() < 44)
+                result += u"%1 is %2x%3, under 44"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height());
+            const QRect whole = widget->rect();
+            if (widget->visibleRegion().boundingRect() != whole)
+                result += u"%1 is cut off"_s.arg(nameOf(*widget));
+        }
+        if (!foreign) {
+            const QString clipped = clippedText(*widget);
+            if (!clipped.isEmpty())
+                result += u"%1: %2"_s.arg(nameOf(*widget), clipped);
+            if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
+                result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
+        }
+        if (english) {
+            QString said = widget->accessibleName() + widget->toolTip();
+            if (button)
+                said += button->text();
+            if (const auto* label = qobject_cast<const QLabel*>(widget))
+                said += label->text();
+            if (const auto* box = qobject_cast<const QComboBox*>(widget))
+                said += box->placeholderText() + box->currentText();
+            if (hasHebrew(said))
+                result += u"Hebrew on an English page: %1: %2"_s.arg(nameOf(*widget), said);
+        }
+    }
+    return result;
+}
+
+} // namespace lumora

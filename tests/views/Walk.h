@@ -1,0 +1,58 @@
+#pragma once
+
+#include "app/Program.h"
+#include "session/Page.h"
+#include "views/ControlFinder.h"
+
+#include <QSize>
+#include <QString>
+#include <QStringList>
+#include <QTemporaryDir>
+
+#include <functional>
+
+namespace lumora {
+
+// The whole program on a fresh drive with a folder of pictures, used as a customer uses it: by pressing controls that
+// are visible, enabled and not covered. A step that fails is a failure of the test that takes it.
+class Walk {
+public:
+    explicit Walk(QSize size, const QString& labSettings = {});
+    ~Walk();
+
+    Program& program() { return *m_program; }
+    QString pictureFolder() const; // drive path
+    template <class P>
+    P& page(PageId id) {
+        return static_cast<P&>(*find(id));
+    }
+
+    void press(const QString& page, const QString& control);
+    void type(const QString& page, const QString& control, const QString& text);
+    bool pressable(const QString& page, const QString& control);
+    // Lets the program work until the page is in front, for some seconds at most.
+    void waitFor(const QString& page);
+    void settle(int milliseconds = 30);
+
+    // From the start page to the page and step named.
+    void toDetails(bool english);
+    void toOptions();
+    void toBorder();
+    void toTerms();
+    void toPictures();
+    void choosePictures();
+    void toClosing();
+
+    // Writes the window to the folder that LUMORA_SHOTS names; without one nothing is written.
+    void shot(const QString& name);
+    // All that is wrong with what the window shows now: each line names the control.
+    QStringList faults(bool english);
+
+private:
+    Page* find(PageId id);
+
+    QTemporaryDir m_folder;
+    std::unique_ptr<Program> m_program;
+};
+
+} // namespace lumora
