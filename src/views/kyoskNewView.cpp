@@ -469,7 +469,6 @@ void kyoskNewView::fitCells() {
     // A cell that was never shown has no true size yet.
     if (m_cells[0]->isVisible())
         m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
-        m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
 }
 
 void kyoskNewView::renderCells() {
