@@ -32,6 +32,7 @@ QSize sizeIn(const QString& text) {
 int play(int argc, char** argv) {
     qputenv("QT_QPA_PLATFORM", "offscreen");
     Application application(argc, argv);
+    Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
 
     QCommandLineParser parser;
     parser.setApplicationDescription(

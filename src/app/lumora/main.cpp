@@ -2,13 +2,21 @@
 #include "views/Application.h"
 #include "views/StartFailure.h"
 
+#include <QByteArrayList>
 #include <QCommandLineParser>
 
+#include <algorithm>
 #include <cstdio>
 
 using namespace lumora;
 
 int main(int argc, char** argv) {
+    // Help needs no screen.
+    const auto asksForHelp = [](const char* word) {
+        return QByteArrayList{"-h", "--help", "-v", "--version"}.contains(QByteArray(word));
+    };
+    if (std::any_of(argv + 1, argv + argc, asksForHelp))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
     Application application(argc, argv);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
     QCommandLineParser parser;
