@@ -219,7 +219,8 @@ void FtpFrmView::makePanels() {
     manual->setSpacing(theme().px(8));
     int at = 0;
     const auto add = [&](const QString& name, const Caption& caption, void (FtpFrm::*handler)()) {
-        manual->addWidget(button(name, caption, Role::Plain, [this, handler] { (m_page.*handler)(); }), at / 5, at % 5);
+        manual->addWidget(button(name, caption, Role::Plain, [&page = m_page, handler] { (page.*handler)(); }), at / 5,
+                          at % 5);
         ++at;
     };
     add(u"Command13"_s, m_page.Command13, &FtpFrm::Command13_Click);

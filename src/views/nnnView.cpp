@@ -96,7 +96,7 @@ QWidget* nnnView::makeDetails() {
                           const Caption& labelCaption, void (nnn::*changed)(const QString&)) {
         auto* title = label(labelName, labelCaption, "strong");
         form->addWidget(title);
-        auto* box = field(name, caption, [this, changed](const QString& text) { (m_page.*changed)(text); });
+        auto* box = field(name, caption, [&page = m_page, changed](const QString& text) { (page.*changed)(text); });
         box->setMaxLength(200);
         title->setBuddy(box);
         form->addWidget(box);
