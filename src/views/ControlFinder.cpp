@@ -107,21 +107,6 @@ Result<void> ControlFinder::press(const QString& page, const QString& control) c
     return {};
 }
 
-Result<void> ControlFinder::doublePress(const QString& page, const QString& control) const {
-    const Result<QWidget*> widget = pressable(page, control);
-    if (!widget)
-        return widget.failure();
-    QWidget& hit = target(**widget);
-    const QPointer<QWidget> alive(&hit);
-    click(hit, middleOf(hit));
-    if (alive && alive->isVisible()) {
-        mouse(*alive, middleOf(*alive), QEvent::MouseButtonDblClick, Qt::LeftButton);
-        if (alive && alive->isVisible())
-            mouse(*alive, middleOf(*alive), QEvent::MouseButtonRelease, Qt::NoButton);
-    }
-    return {};
-}
-
 Result<void> ControlFinder::type(const QString& page, const QString& control, const QString& text) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)

@@ -24,7 +24,6 @@ public:
 
     // Each takes the page's name; a page that is not in front is a failure.
     Result<void> press(const QString& page, const QString& control) const;
-    Result<void> doublePress(const QString& page, const QString& control) const;
     // Replaces what the text box holds.
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
     // The row of a list or of a combo box with this text.

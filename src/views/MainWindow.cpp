@@ -81,7 +81,6 @@ void MainWindow::bringToFront(PageView* view) {
         if (QWidget* first = view->firstFocus())
             first->setFocus(Qt::OtherFocusReason);
     }
-    Q_EMIT frontChanged();
 }
 
 void MainWindow::pageUnloaded(Page* page) {
@@ -124,7 +123,6 @@ void MainWindow::rebuild() {
                 bringToFront(fresh);
         }
     }
-    Q_EMIT themeChanged();
 }
 
 void MainWindow::closeEvent(QCloseEvent* event) {

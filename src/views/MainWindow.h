@@ -39,11 +39,6 @@ public:
     // Renders what waits for the next turn of the event loop, at once.
     void renderNow();
 
-Q_SIGNALS:
-    // The theme, and with it every size, has changed.
-    void themeChanged();
-    void frontChanged();
-
 protected:
     void resizeEvent(QResizeEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
