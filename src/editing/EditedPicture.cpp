@@ -22,18 +22,18 @@ ColourMatrix coloursOf(const EditFields& edit) {
     return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
 }
 
-Caption captionOf(const EditFields& edit) {
+PictureCaption captionOf(const EditFields& edit) {
     const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
-    Caption caption;
+    PictureCaption caption;
     caption.text = edit.TextBody;
     caption.family = edit.TextFont;
     caption.emSize = edit.TextFontSize;
     caption.bold = (edit.TextStyle & 1) != 0;
     caption.italic = (edit.TextStyle & 2) != 0;
-    caption.align = edit.TextAlign == 1   ? Caption::Align::Centre
-                    : edit.TextAlign == 2 ? Caption::Align::Far
-                                          : Caption::Align::Near;
-    caption.run = edit.TextVertical == 3 ? Caption::Run::Down : Caption::Run::Across;
+    caption.align = edit.TextAlign == 1   ? PictureCaption::Align::Centre
+                    : edit.TextAlign == 2 ? PictureCaption::Align::Far
+                                          : PictureCaption::Align::Near;
+    caption.run = edit.TextVertical == 3 ? PictureCaption::Run::Down : PictureCaption::Run::Across;
     caption.colour = QColor(channel(edit.TextRed), channel(edit.TextGreen), channel(edit.TextBlue));
     caption.x = edit.TextX;
     caption.y = edit.TextY;

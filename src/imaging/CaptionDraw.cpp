@@ -53,7 +53,7 @@ OutlinedLine outlined(const QString& text, const QFont& font) {
 
 } // namespace
 
-void drawCaption(Bitmap& paper, const Caption& caption, PaperScale scale) {
+void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale) {
     const QString family = installedFamily(caption.family);
     if (paper.isNull() || family.isEmpty() || caption.text.isEmpty())
         return;
@@ -72,9 +72,9 @@ void drawCaption(Bitmap& paper, const Caption& caption, PaperScale scale) {
         text.remove(u'\r');
         const OutlinedLine line = outlined(text, font);
         const double length = line.advance + em / 3;
-        const double left = caption.align == Caption::Align::Far      ? -length
-                            : caption.align == Caption::Align::Centre ? -length / 2
-                                                                      : 0.0;
+        const double left = caption.align == PictureCaption::Align::Far      ? -length
+                            : caption.align == PictureCaption::Align::Centre ? -length / 2
+                                                                             : 0.0;
         block.addPath(line.path.translated(left + em / 6, top + metrics.ascent()));
         top += metrics.lineSpacing();
     }
@@ -85,7 +85,7 @@ void drawCaption(Bitmap& paper, const Caption& caption, PaperScale scale) {
     const double size = std::max(8, caption.emSize) * scale.x / em;
     const auto paint = [&](double x, double y, const QColor& colour) {
         QTransform place = QTransform::fromTranslate(x * scale.x, y * scale.y);
-        if (caption.run == Caption::Run::Down)
+        if (caption.run == PictureCaption::Run::Down)
             place.rotate(90);
         place.scale(size, size);
         painter.fillPath(place.map(block), colour);

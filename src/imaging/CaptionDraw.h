@@ -8,7 +8,7 @@
 namespace lumora {
 
 // A caption as an edit record carries it; sizes and places in pixels of the preview.
-struct Caption {
+struct PictureCaption {
     enum class Align { Near, Centre, Far };
     enum class Run { Across, Down };
 
@@ -34,6 +34,6 @@ struct PaperScale {
 // advance and a third of an em long and starts a sixth inside that; it begins, is centred or ends at the anchor, whose
 // height is the top of the first line's box. Base direction left to right; lines that run down are the same block
 // turned a quarter clockwise, its right edge at the anchor. Needs a QGuiApplication.
-void drawCaption(Bitmap& paper, const Caption& caption, PaperScale scale = {});
+void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale = {});
 
 } // namespace lumora

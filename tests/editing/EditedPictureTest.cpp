@@ -162,8 +162,8 @@ QRect inkOf(const Bitmap& paper) {
     return ink;
 }
 
-QRect inkOfCaption(Caption::Align align, Caption::Run run, double scale = 1) {
-    Caption caption;
+QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double scale = 1) {
+    PictureCaption caption;
     caption.text = QStringLiteral("HHHH\r\nH");
     caption.family = QStringLiteral("DejaVu Sans");
     caption.emSize = 24;
@@ -177,8 +177,8 @@ QRect inkOfCaption(Caption::Align align, Caption::Run run, double scale = 1) {
 }
 
 TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
-    using Align = Caption::Align;
-    using Run = Caption::Run;
+    using Align = PictureCaption::Align;
+    using Run = PictureCaption::Run;
     // Four letters of 0.752 em and a third of an em; the base line of the first line is 22 below the anchor, the pitch
     // 28. The letter's own bearing is a tenth of an em.
     const double length = 24 * (4 * 0.752 + 1 / 3.0);
@@ -204,7 +204,7 @@ TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
 }
 
 TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
-    Caption caption;
+    PictureCaption caption;
     caption.text = QStringLiteral("שלום Lumora 2024");
     caption.family = QStringLiteral("No Such Family");
     Bitmap paper(200, 60, Qt::white);
