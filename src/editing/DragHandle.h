@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QPointF>
+
+#include <optional>
+
+namespace lumora {
+
+// A handle that follows the pointer at a thirteenth of its way at each move, measured from where it was pressed: the
+// anchor stays, so that a far drag goes faster and a pointer that stands still moves nothing. Fractions are kept.
+class DragHandle {
+public:
+    static constexpr double slowness = 13;
+
+    void press(QPointF at) { m_anchor = at; }
+    void release() { m_anchor.reset(); }
+    bool held() const { return m_anchor.has_value(); }
+
+    // How far this move takes the handle; nothing while it is not held.
+    QPointF distance(QPointF at) const { return m_anchor ? (at - *m_anchor) / slowness : QPointF(); }
+    void move(QPointF at) { m_position += distance(at); }
+
+    QPointF position() const { return m_position; }
+    void put(QPointF position) { m_position = position; }
+
+private:
+    QPointF m_position;
+    std::optional<QPointF> m_anchor;
+};
+
+} // namespace lumora

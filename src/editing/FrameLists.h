@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+namespace lumora {
+
+class Files;
+
+// The frames that lie in the folder of frames: a sub-folder a category, in it "k<name>.bmp", the frame that the preview
+// shows, and list files of the bare name. A name that is too long for its field of the record is not offered.
+class FrameLists {
+public:
+    static constexpr int longestCategory = 10;
+    static constexpr int longestName = 3;
+
+    FrameLists(const Files& files, QString folder)
+        : m_files(files)
+        , m_folder(std::move(folder)) {}
+
+    QStringList categories() const;
+
+    // The names by one kind of list file, without its last four characters and without what begins with "k".
+    enum class ListFile { Png, Bmp };
+    QStringList names(const QString& category, ListFile kind) const;
+
+    // The drive path of the file that stands for a frame in the list; empty when there is none.
+    QString listFile(const QString& category, const QString& name) const;
+
+private:
+    const Files& m_files;
+    QString m_folder;
+};
+
+} // namespace lumora

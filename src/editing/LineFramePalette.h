@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QChar>
+#include <QPointF>
+#include <QRect>
+
+namespace lumora {
+
+// The palette of line frames: twelve colours in three columns of four cells, numbered down the columns, and the marker
+// that jumps to the cell under the pointer.
+class LineFramePalette {
+public:
+    static constexpr int cell = 33;
+    static constexpr int columns = 3;
+    static constexpr int rows = 4;
+    static constexpr int bottom = 124; // below it the pointer moves nothing
+
+    // A point of the palette. Outside its cells the marker stays.
+    void moveTo(QPointF at);
+
+    int index() const { return m_index; }
+    QRect marker() const;
+
+    // The letter of the cell under the marker, as the record carries it.
+    QChar letter() const;
+
+private:
+    int m_index = 0;
+};
+
+} // namespace lumora
