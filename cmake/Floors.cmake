@@ -41,12 +41,16 @@ function(lumora_floor name)
   lumora_uses(floor_${name} ${FLOOR_USES})
 endfunction()
 
-# lumora_test(NAME USES ...): the test program test_NAME from all sources of this folder, run on Qt's offscreen platform.
+# lumora_test(NAME USES ...): the test program test_NAME from all sources of this folder, run on Qt's offscreen platform. tests/Main.cpp is
+# its main unless the folder has a Main.cpp of its own.
 function(lumora_test name)
   cmake_parse_arguments(SUITE "" "" "USES" ${ARGN})
   file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.h ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
+  if(NOT EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/Main.cpp)
+    list(APPEND sources ${PROJECT_SOURCE_DIR}/tests/Main.cpp)
+  endif()
   add_executable(test_${name} ${sources})
-  lumora_uses(test_${name} ${SUITE_USES} GTest::gtest GTest::gmock)
+  lumora_uses(test_${name} ${SUITE_USES} Qt6::Gui GTest::gtest GTest::gmock)
   gtest_discover_tests(test_${name} TEST_PREFIX "${name}." DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60
     PROPERTIES TIMEOUT 300 ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_LOGGING_RULES=qt.qpa.*=false")
 endfunction()

@@ -1,4 +1,4 @@
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "support/SamplePhotographs.h"
 
 #include <cstdio>

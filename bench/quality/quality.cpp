@@ -1,7 +1,7 @@
 // Luma of prints against an antialiased bicubic in double precision: before encoding, and what quality 90 loses beside
 // the exact picture encoded in the same way.
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/PlaneScaler.h"
 #include "imaging/Resample.h"

@@ -1,6 +1,6 @@
 // The stages of the picture path, one picture of 12 megapixels: what each costs, and each kind of vectors.
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/Resample.h"
 #include "support/SamplePhotographs.h"

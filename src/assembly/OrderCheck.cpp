@@ -93,7 +93,7 @@ public:
         , m_shape(shape)
         , m_log(std::move(log)) {}
 
-    OrderReport run(const QString& folderName) {
+    OrderFindings run(const QString& folderName) {
         m_report.order = m_log.order;
         m_report.items = static_cast<int>(m_log.items.size());
         m_report.failed = static_cast<int>(m_log.failed.size());
@@ -211,7 +211,7 @@ private:
     const PrintFileShape m_shape;
     const ReadLog m_log;
     QMultiMap<int, QString> m_made;
-    OrderReport m_report;
+    OrderFindings m_report;
 };
 
 } // namespace
@@ -240,7 +240,7 @@ Result<void> checkWholeJpeg(const QByteArray& bytes) {
     return {};
 }
 
-Result<OrderReport> checkOrderFolder(const fs::path& folder, PrintFileShape shape) {
+Result<OrderFindings> checkOrderFolder(const fs::path& folder, PrintFileShape shape) {
     std::error_code error;
     if (!fs::is_directory(folder, error))
         return Failure{Failure::Kind::NotFound, QStringLiteral("%1: no such folder").arg(toText(folder))};

@@ -1,6 +1,6 @@
 #include "imaging/JpegReader.h"
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/ColourPlanes.h"
 #include "imaging/JpegErrors.h"
 

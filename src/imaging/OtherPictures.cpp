@@ -1,6 +1,6 @@
 #include "imaging/OtherPictures.h"
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 
 #include <QBuffer>
 #include <QImageReader>

@@ -1,7 +1,7 @@
 #include "imaging/PictureFile.h"
 
 #include "common/FixedText.h"
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/JpegReader.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/OtherPictures.h"

@@ -1,6 +1,6 @@
 #include "imaging/PictureInput.h"
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 
 #include <array>
 #include <cerrno>

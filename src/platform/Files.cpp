@@ -1,7 +1,7 @@
 #include "platform/Files.h"
 
 #include "common/AnsiCodePage.h"
-#include "platform/NewContent.h"
+#include "common/HostFile.h"
 
 #include <sys/stat.h>
 #include <unistd.h>

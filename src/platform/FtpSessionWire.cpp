@@ -1,8 +1,8 @@
 #include "platform/FtpSessionWire.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/HostFile.h"
 #include "platform/FtpListing.h"
-#include "platform/NewContent.h"
 
 #include <Poco/Exception.h>
 #include <Poco/Net/NetException.h>

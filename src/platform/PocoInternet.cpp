@@ -1,8 +1,8 @@
 #include "platform/PocoInternet.h"
 
+#include "common/HostFile.h"
 #include "platform/BlockingCall.h"
 #include "platform/HttpGet.h"
-#include "platform/NewContent.h"
 
 #include <ifaddrs.h>
 #include <net/if.h>

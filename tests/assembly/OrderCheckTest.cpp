@@ -15,7 +15,7 @@ protected:
     }
 
     QStringList faults() const {
-        const Result<OrderReport> report =
+        const Result<OrderFindings> report =
             checkOrderFolder(*machine.drives.toHost(folder()), PrintFileShape::of(state.profile));
         return report ? report->faults : QStringList(report.failure().message);
     }
@@ -36,7 +36,7 @@ protected:
 };
 
 TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
-    const Result<OrderReport> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
+    const Result<OrderFindings> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
     ASSERT_TRUE(report);
     EXPECT_EQ(report->faults, QStringList());
     EXPECT_EQ(report->order, QStringLiteral("2026_11_21_KUP_1234^105"));

@@ -1,5 +1,5 @@
 #include "JpegOfKind.h"
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/PictureFile.h"
 
 #include <QDir>

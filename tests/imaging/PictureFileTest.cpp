@@ -1,7 +1,7 @@
 #include "imaging/PictureFile.h"
 
 #include "JpegOfKind.h"
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 
 #include <QBuffer>
 #include <QDir>

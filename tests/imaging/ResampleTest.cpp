@@ -1,7 +1,7 @@
 #include "imaging/Resample.h"
 
 #include "JpegOfKind.h"
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "imaging/Drawing.h"
 #include "imaging/PlaneScaler.h"
 #include "support/ReferenceScaling.h"

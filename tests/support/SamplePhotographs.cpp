@@ -1,6 +1,6 @@
 #include "support/SamplePhotographs.h"
 
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 
 #include <QLinearGradient>
 #include <QPainter>

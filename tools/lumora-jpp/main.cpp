@@ -95,7 +95,7 @@ int unpack(const QString& source, const QString& target, PrintFileShape shape) {
 int check(const QStringList& folders, PrintFileShape shape) {
     int code = allWell;
     for (const QString& folder : folders) {
-        const Result<OrderReport> report = checkOrderFolder(toHostPath(folder), shape);
+        const Result<OrderFindings> report = checkOrderFolder(toHostPath(folder), shape);
         if (!report) {
             err() << report.failure().message << Qt::endl;
             code = faultFound;

@@ -1,7 +1,7 @@
 // The renderers without an order: for support, and for measuring.
 
 #include "assembly/PaperResize.h"
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 #include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
 #include "imaging/PictureFile.h"

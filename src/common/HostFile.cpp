@@ -1,20 +1,50 @@
-#include "platform/NewContent.h"
-
-#include "common/WholeFile.h"
+#include "common/HostFile.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <atomic>
 #include <cerrno>
-#include <cstdlib>
 #include <cstring>
+#include <string>
 #include <utility>
 
 namespace lumora {
 
+namespace {
+
+Failure::Kind kindOf(int error) {
+    switch (error) {
+    case ENOENT:
+    case ENOTDIR:
+        return Failure::Kind::NotFound;
+    case EACCES:
+    case EPERM:
+    case EROFS:
+        return Failure::Kind::AccessDenied;
+    case ENOSPC:
+    case EDQUOT:
+        return Failure::Kind::NoSpace;
+    case EFBIG:
+        return Failure::Kind::TooLarge;
+    default:
+        return Failure::Kind::Other;
+    }
+}
+
+QString nameOf(const std::filesystem::path& path) {
+    return QString::fromLocal8Bit(path.c_str());
+}
+
+} // namespace
+
 Failure systemFailure(int error, const QString& path) {
-    return {failureKind(error), QStringLiteral("%1: %2").arg(path, QString::fromLocal8Bit(std::strerror(error)))};
+    return {kindOf(error), QStringLiteral("%1: %2").arg(path, QString::fromLocal8Bit(std::strerror(error)))};
+}
+
+Failure fileFailure(const std::filesystem::path& path, const QString& what, int error) {
+    return systemFailure(error, QStringLiteral("%1: %2").arg(nameOf(path), what));
 }
 
 Descriptor::Descriptor(Descriptor&& other) noexcept
@@ -32,7 +62,7 @@ int Descriptor::close() {
     return m_number < 0 ? 0 : ::close(std::exchange(m_number, -1));
 }
 
-Result<Descriptor> openSource(const HostPath& host, const QString& path) {
+Result<Descriptor> openSource(const std::filesystem::path& host, const QString& path) {
     Descriptor source(::open(host.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
     struct stat status {};
     if (!source.valid() || ::fstat(source.number(), &status) != 0)
@@ -52,15 +82,20 @@ Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t 
     }
 }
 
-NewContent::NewContent(HostPath target, QString path)
+// The temporary name is short and does not grow from the final one, which may already be as long as a name can be.
+NewContent::NewContent(std::filesystem::path target, QString path)
     : m_target(std::move(target))
     , m_path(std::move(path)) {
-    std::string name = (m_target.parent_path() / ".lumora-XXXXXX").native();
-    m_file = Descriptor(::mkostemp(name.data(), O_CLOEXEC));
-    if (m_file.valid())
-        m_temporary = name;
-    else
+    static std::atomic<unsigned> counter{0};
+    do {
+        m_temporary = m_target.parent_path() /
+                      (".lumora-" + std::to_string(::getpid()) + "-" + std::to_string(counter++) + ".tmp");
+        m_file = Descriptor(::open(m_temporary.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666));
+    } while (!m_file.valid() && errno == EEXIST);
+    if (!m_file.valid()) {
         m_error = errno;
+        m_temporary.clear();
+    }
 }
 
 NewContent::~NewContent() {
@@ -98,6 +133,12 @@ Result<void> NewContent::commit() {
     if (folder.valid())
         ::fsync(folder.number());
     return {};
+}
+
+Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes) {
+    NewContent content(path, QStringLiteral("%1: can't be written").arg(nameOf(path)));
+    content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
+    return content.commit();
 }
 
 } // namespace lumora

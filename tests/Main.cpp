@@ -2,7 +2,8 @@
 
 #include <gtest/gtest.h>
 
-// Captions need the fonts that a QGuiApplication loads.
+// The main() of every suite without one of its own. Fonts, which sheets and captions are drawn with, need an
+// application.
 int main(int argc, char** argv) {
     testing::InitGoogleTest(&argc, argv);
     const QGuiApplication application(argc, argv);

@@ -1,14 +1,18 @@
 #pragma once
 
 #include "common/Result.h"
-#include "platform/HostPath.h"
 
+#include <QByteArray>
 #include <QString>
 
+#include <filesystem>
+
+// Files of this machine, read and written whole. A failure's message names the path, or what the caller calls it.
 namespace lumora {
 
-// What errno says, as a failure whose message names the path.
+// What errno says: "PATH: reason", and where what is told too, "PATH: what: reason".
 Failure systemFailure(int error, const QString& path);
+Failure fileFailure(const std::filesystem::path& path, const QString& what, int error);
 
 // A file descriptor that is closed at the end.
 class Descriptor {
@@ -27,8 +31,8 @@ private:
     int m_number;
 };
 
-// For reading only, and only what is a plain file: a pipe would wait for ever. path is what a failure names.
-Result<Descriptor> openSource(const HostPath& host, const QString& path);
+// For reading only, and only what is a plain file: a pipe would wait for ever.
+Result<Descriptor> openSource(const std::filesystem::path& host, const QString& path);
 
 // The next bytes of an open file, up to the capacity given; 0 at the end.
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
@@ -37,8 +41,7 @@ Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t 
 // file or the new one. Nothing stays behind when it is not committed.
 class NewContent {
 public:
-    // path is what a failure names.
-    NewContent(HostPath target, QString path);
+    NewContent(std::filesystem::path target, QString path);
     NewContent(const NewContent&) = delete;
     NewContent& operator=(const NewContent&) = delete;
     ~NewContent();
@@ -51,11 +54,14 @@ public:
     Result<void> commit();
 
 private:
-    HostPath m_target;
+    std::filesystem::path m_target;
     QString m_path;
-    HostPath m_temporary;
+    std::filesystem::path m_temporary;
     Descriptor m_file;
     int m_error = 0;
 };
+
+// All of it at once.
+Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes);
 
 } // namespace lumora
