@@ -15,7 +15,6 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr float crossGain = 1.0F / 1000.0F;
-constexpr float greyWeight = 0.3F;
 constexpr int printQuality = 90;
 
 ColourMatrix coloursOf(const EditFields& edit) {

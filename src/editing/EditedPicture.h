@@ -16,6 +16,10 @@ namespace lumora {
 
 struct EditFields;
 
+// A tone makes the picture grey first: this much of red, green and blue together, so that white comes out at nine
+// tenths.
+inline constexpr float greyWeight = 0.3F;
+
 enum class FrameUse { Preview, Print };
 
 // The frame of a record out of the folder that holds the categories: "k<name>.bmp" is what the preview shows and
