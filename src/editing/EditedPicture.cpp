@@ -1,6 +1,5 @@
 #include "editing/EditedPicture.h"
 
-#include "imaging/CaptionDraw.h"
 #include "imaging/ColourMatrix.h"
 #include "imaging/Resample.h"
 #include "imaging/Stopwatch.h"
@@ -8,6 +7,7 @@
 #include "session/SessionState.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace lumora {
 namespace {
@@ -39,15 +39,17 @@ PictureCaption captionOf(const EditFields& edit) {
     return caption;
 }
 
-// The one drawing of preview and print: picture, frame, caption over what the paper shows.
-void drawEdited(Bitmap& paper, const Bitmap* picture, const Placement& placement, const EditFields& edit,
-                const std::optional<Bitmap>& frame, PaperScale scale) {
-    if (picture != nullptr)
-        drawPlaced(paper, *picture, placement, coloursOf(edit));
-    if (frame)
-        drawKeyedFrame(paper, *frame);
-    if (edit.TextOn == 1)
-        drawCaption(paper, captionOf(edit), scale);
+// The one drawing of preview and print: picture, frame, caption over what the paper shows. A null bitmap is left out.
+void drawEdited(Bitmap& paper, const Bitmap& picture, const Placement& placement, const EditFields& edit,
+                const Bitmap& keyedFrame, const CaptionInk& ink) {
+    drawPlaced(paper, picture, placement, coloursOf(edit));
+    drawKeyedFrame(paper, keyedFrame);
+    drawInk(paper, ink);
+}
+
+PictureSize scaledSize(PictureSize size, double scale) {
+    const auto side = [scale](int pixels) { return std::max(1, static_cast<int>(std::lround(pixels * scale))); };
+    return {side(size.width), side(size.height)};
 }
 
 bool touches(const Placement& placement, PictureSize paper) {
@@ -99,7 +101,8 @@ std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& 
     return load(u'k' + name);
 }
 
-Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits paper, int zoomPercent, Tone tone) {
+Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits paper, int zoomPercent, Tone tone,
+                                          double largestScale) {
     const auto size = readPictureSize(file);
     if (!size)
         return size.failure();
@@ -109,28 +112,32 @@ Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits pape
                                                     .arg(toText(file))
                                                     .arg(size->width)
                                                     .arg(size->height)};
-    const auto work = loadPictureScaled(file, *workSize);
-    if (!work)
-        return work.failure();
+    const PictureSize most = scaledSize(*workSize, largestScale);
+    const PictureSize sharp{std::clamp(most.width, workSize->width, std::max(workSize->width, size->width)),
+                            std::clamp(most.height, workSize->height, std::max(workSize->height, size->height))};
+    const auto loaded = loadPictureScaled(file, sharp);
+    if (!loaded)
+        return loaded.failure();
     EditedPreview preview;
     preview.m_box = previewBox(paper, orientationOf(*size));
-    preview.m_work = onWhite(*work);
+    preview.m_work = onWhite(*loaded);
+    if (sharp != *workSize) {
+        preview.m_sharp = preview.m_work;
+        preview.m_work = resampled(preview.m_sharp, *workSize);
+    }
+    if (preview.m_work.isNull())
+        return noRoom(file, *workSize);
     if (tone == Tone::Grey)
         preview.turnGrey();
-    else
-        preview.stretchBackground();
-    if (preview.m_background.isNull())
-        return noRoom(file, preview.m_box);
     return preview;
 }
 
 void EditedPreview::turnGrey() {
-    m_work = ColourMatrix::grey(greyWeight).applied(m_work);
-    stretchBackground();
-}
-
-void EditedPreview::stretchBackground() {
-    m_background = resampled(m_work, m_box);
+    const ColourMatrix grey = ColourMatrix::grey(greyWeight);
+    m_work = grey.applied(m_work);
+    if (!m_sharp.isNull())
+        m_sharp = grey.applied(m_sharp);
+    m_overlay = {};
 }
 
 void EditedPreview::placeAtCentreIfUnset(EditFields& edit) const {
@@ -142,12 +149,43 @@ void EditedPreview::placeAtCentreIfUnset(EditFields& edit) const {
 }
 
 void EditedPreview::setBackground(QColor colour) {
-    m_background = Bitmap(m_box.width, m_box.height, colour);
+    m_colour = colour;
+    m_overlay = {};
 }
 
-Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>& frame) const {
-    Bitmap paper = m_background;
-    drawEdited(paper, &m_work, previewPlacement({m_work.width(), m_work.height()}, m_box, edit), edit, frame, {});
+void EditedPreview::prepareOverlay(const EditFields& edit, const std::optional<Bitmap>& frame, double scale) {
+    const PictureSize size = scaledSize(m_box, scale);
+    if (m_overlay.scale != scale) {
+        m_overlay = {};
+        m_overlay.scale = scale;
+        m_overlay.background =
+            m_colour ? Bitmap(size.width, size.height, *m_colour) : resampled(sourceFor(scale), size);
+    }
+    if (!frame) {
+        m_overlay.frame = {};
+        m_overlay.frameKey = 0;
+    } else if (m_overlay.frame.isNull() || m_overlay.frameKey != frame->image().cacheKey()) {
+        m_overlay.frame = keyedFrame(*frame, size);
+        m_overlay.frameKey = frame->image().cacheKey();
+    }
+    if (edit.TextOn != 1) {
+        m_overlay.ink = {};
+        m_overlay.caption = {};
+    } else if (const PictureCaption caption = captionOf(edit); m_overlay.caption != caption) {
+        m_overlay.ink = inkOf(caption, size, {scale, scale});
+        m_overlay.caption = caption;
+    }
+}
+
+Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale) {
+    prepareOverlay(edit, frame, scale);
+    Placement placement = previewPlacement({m_work.width(), m_work.height()}, m_box, edit);
+    placement.drawWidth *= scale;
+    placement.drawHeight *= scale;
+    placement.panX *= scale;
+    placement.panY *= scale;
+    Bitmap paper = m_overlay.background;
+    drawEdited(paper, sourceFor(scale), placement, edit, m_overlay.frame, m_overlay.ink);
     return paper;
 }
 
@@ -183,8 +221,10 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
                              : Bitmap(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
     if (paper.isNull())
         return noRoom(print.file, geometry.size);
-    drawEdited(paper, shows ? &picture : nullptr, placement, edit, loadFrame(print.framesFolder, edit, FrameUse::Print),
-               {geometry.scaleX, geometry.scaleY});
+    const auto frame = loadFrame(print.framesFolder, edit, FrameUse::Print);
+    drawEdited(paper, shows ? picture : Bitmap(), placement, edit, frame ? keyedFrame(*frame, geometry.size) : Bitmap(),
+               edit.TextOn == 1 ? inkOf(captionOf(edit), geometry.size, {geometry.scaleX, geometry.scaleY})
+                                : CaptionInk());
     watch.add(&PictureTimes::draw);
     return paper;
 }

@@ -3,10 +3,12 @@
 #include "common/Result.h"
 #include "editing/PicturePlacement.h"
 #include "imaging/Bitmap.h"
+#include "imaging/CaptionDraw.h"
 
 #include <QByteArray>
 #include <QColor>
 
+#include <cstdint>
 #include <filesystem>
 #include <optional>
 
@@ -31,9 +33,11 @@ std::optional<Bitmap> loadFrame(const std::filesystem::path& framesFolder, const
 class EditedPreview {
 public:
     // zoomPercent decides the size of the work picture and stays so. The file may be a corrected copy. grey: the
-    // record's tone flag.
+    // record's tone flag. largestScale: how much larger than the box render() will be asked to draw; that many more
+    // pixels are kept where the file has them.
     enum class Tone { Colour, Grey };
-    static Result<EditedPreview> open(const std::filesystem::path& file, PaperDigits paper, int zoomPercent, Tone tone);
+    static Result<EditedPreview> open(const std::filesystem::path& file, PaperDigits paper, int zoomPercent, Tone tone,
+                                      double largestScale = 1);
 
     PictureSize box() const { return m_box; }
     const Bitmap& workPicture() const { return m_work; }
@@ -47,16 +51,32 @@ public:
     // What an uncovered part of the paper shows; without it the whole picture, stretched.
     void setBackground(QColor colour);
 
-    // In the box's size; frame as loadFrame gives it, or none.
-    Bitmap render(const EditFields& edit, const std::optional<Bitmap>& frame) const;
+    // In the box's size times scale, rounded; every number of pixels in the record is multiplied by it, as the print
+    // does. frame as loadFrame gives it, or none. What a tick leaves as it was is kept for the next one: the stretched
+    // frame as long as the very same bitmap comes (so keep it rather than loading it each time), the caption as long as
+    // its fields stay.
+    Bitmap render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale = 1);
 
 private:
     EditedPreview() = default;
-    void stretchBackground();
+
+    // What lies over the picture at one scale.
+    struct Overlay {
+        double scale = 0;
+        Bitmap background;
+        std::int64_t frameKey = 0;
+        Bitmap frame;
+        PictureCaption caption;
+        CaptionInk ink;
+    };
+    const Bitmap& sourceFor(double scale) const { return scale > 1 && !m_sharp.isNull() ? m_sharp : m_work; }
+    void prepareOverlay(const EditFields& edit, const std::optional<Bitmap>& frame, double scale);
 
     PictureSize m_box;
     Bitmap m_work;
-    Bitmap m_background;
+    Bitmap m_sharp; // the work picture with more pixels, or null
+    std::optional<QColor> m_colour;
+    Overlay m_overlay;
 };
 
 struct EditedPrint {

@@ -53,10 +53,10 @@ OutlinedLine outlined(const QString& text, const QFont& font) {
 
 } // namespace
 
-void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale) {
+CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale) {
     const QString family = installedFamily(caption.family);
-    if (paper.isNull() || family.isEmpty() || caption.text.isEmpty())
-        return;
+    if (family.isEmpty() || caption.text.isEmpty())
+        return {};
     QFont font(family);
     font.setPixelSize(layoutSize);
     font.setBold(caption.bold);
@@ -80,18 +80,32 @@ void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale)
     }
     block.setFillRule(Qt::WindingFill);
 
-    QPainter painter(&paper.image());
-    painter.setRenderHint(QPainter::Antialiasing);
     const double size = std::max(8, caption.emSize) * scale.x / em;
-    const auto paint = [&](double x, double y, const QColor& colour) {
+    const auto placed = [&](double x, double y) {
         QTransform place = QTransform::fromTranslate(x * scale.x, y * scale.y);
         if (caption.run == PictureCaption::Run::Down)
             place.rotate(90);
         place.scale(size, size);
-        painter.fillPath(place.map(block), colour);
+        return place.map(block);
     };
-    paint(caption.x, caption.y, QColor(40, 40, 40, 180));
-    paint(caption.x - 2, caption.y - 2, caption.colour);
+    const QPainterPath shadow = placed(caption.x, caption.y);
+    const QPainterPath text = placed(caption.x - 2, caption.y - 2);
+    const QRect shown = (shadow.controlPointRect() | text.controlPointRect()).toAlignedRect().adjusted(-1, -1, 1, 1) &
+                        QRect(0, 0, paper.width, paper.height);
+    CaptionInk ink{Bitmap(shown.width(), shown.height(), Qt::transparent), shown.topLeft()};
+    if (ink.pixels.isNull())
+        return {};
+    QPainter painter(&ink.pixels.image());
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.translate(-shown.topLeft());
+    painter.fillPath(shadow, QColor(40, 40, 40, 180));
+    painter.fillPath(text, caption.colour);
+    return ink;
+}
+
+void drawInk(Bitmap& paper, const CaptionInk& ink) {
+    if (!paper.isNull() && !ink.pixels.isNull())
+        QPainter(&paper.image()).drawImage(ink.at, ink.pixels.image());
 }
 
 } // namespace lumora

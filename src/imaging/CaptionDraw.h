@@ -1,8 +1,10 @@
 #pragma once
 
 #include "imaging/Bitmap.h"
+#include "imaging/PictureFile.h"
 
 #include <QColor>
+#include <QPoint>
 #include <QString>
 
 namespace lumora {
@@ -22,6 +24,7 @@ struct PictureCaption {
     QColor colour = Qt::black;
     int x = 0;
     int y = 0;
+    bool operator==(const PictureCaption&) const = default;
 };
 
 // What the pixels of the preview become on the paper; 1 for the preview itself. Letters take their size by x.
@@ -30,10 +33,18 @@ struct PaperScale {
     double y = 1;
 };
 
-// Draws the caption over its shadow: the shadow at the anchor, the text 2 pixels up and to the left. A line is its
-// advance and a third of an em long and starts a sixth inside that; it begins, is centred or ends at the anchor, whose
-// height is the top of the first line's box. Base direction left to right; lines that run down are the same block
-// turned a quarter clockwise, its right edge at the anchor. Needs a QGuiApplication.
-void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale = {});
+// A caption in pixels: its shadow at the anchor, the text over it 2 pixels up and to the left. A line is its advance
+// and a third of an em long and starts a sixth inside that; it begins, is centred or ends at the anchor, whose height
+// is the top of the first line's box. Base direction left to right; lines that run down are the same block turned a
+// quarter clockwise, its right edge at the anchor.
+struct CaptionInk {
+    Bitmap pixels; // what the paper can show; transparent between the letters, null where nothing shows
+    QPoint at;     // where its corner lies on the paper
+};
+
+// Needs a QGuiApplication.
+CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale = {});
+
+void drawInk(Bitmap& paper, const CaptionInk& ink);
 
 } // namespace lumora

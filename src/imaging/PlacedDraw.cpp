@@ -253,9 +253,7 @@ void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement,
     }
 }
 
-void drawKeyedFrame(Bitmap& paper, const Bitmap& frame) {
-    if (paper.isNull() || frame.isNull())
-        return;
+Bitmap keyedFrame(const Bitmap& frame, PictureSize paper) {
     QImage keyed = frame.image().convertToFormat(QImage::Format_ARGB32);
     for (int y = 0; y < keyed.height(); ++y) {
         auto* row = reinterpret_cast<QRgb*>(keyed.scanLine(y));
@@ -264,9 +262,12 @@ void drawKeyedFrame(Bitmap& paper, const Bitmap& frame) {
             row[x] = (row[x] & 0x00FFFFFFU) | (static_cast<QRgb>(std::min(255, 11 * sum)) << 24);
         }
     }
-    const Bitmap stretched = resampled(Bitmap(keyed), {paper.width(), paper.height()});
-    QPainter painter(&paper.image());
-    painter.drawImage(0, 0, stretched.image());
+    return resampled(Bitmap(keyed), paper);
+}
+
+void drawKeyedFrame(Bitmap& paper, const Bitmap& keyed) {
+    if (!paper.isNull() && !keyed.isNull())
+        QPainter(&paper.image()).drawImage(0, 0, keyed.image());
 }
 
 } // namespace lumora

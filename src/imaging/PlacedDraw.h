@@ -46,8 +46,11 @@ PictureSize reducedSize(PictureSize source, const Placement& placement);
 // larger than reducedSize() is reduced first.
 void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement, const ColourMatrix& matrix);
 
-// Lays a frame over the whole paper: alpha = min(255, 11 * (red + green + blue)), so that black is transparent; the
-// alpha is taken before the stretching, and colours are weighted by it.
-void drawKeyedFrame(Bitmap& paper, const Bitmap& frame);
+// A frame stretched to the size of the paper: alpha = min(255, 11 * (red + green + blue)), so that black is
+// transparent; the alpha is taken before the stretching, and colours are weighted by it. Null where memory is short.
+Bitmap keyedFrame(const Bitmap& frame, PictureSize paper);
+
+// Lays it over the whole paper.
+void drawKeyedFrame(Bitmap& paper, const Bitmap& keyed);
 
 } // namespace lumora

@@ -151,7 +151,7 @@ TEST_F(EditedPictureTest, aPictureThatCanNotBeReadIsAFailureAndARecordOfLettersI
 }
 
 // The box of the pixels that are not white.
-QRect inkOf(const Bitmap& paper) {
+QRect darkBox(const Bitmap& paper) {
     QRect ink;
     for (int y = 0; y < paper.height(); ++y) {
         for (int x = 0; x < paper.width(); ++x) {
@@ -172,8 +172,8 @@ QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double 
     caption.x = 200;
     caption.y = 150;
     Bitmap paper(static_cast<int>(400 * scale), static_cast<int>(300 * scale), Qt::white);
-    drawCaption(paper, caption, {scale, scale});
-    return inkOf(paper);
+    drawInk(paper, inkOf(caption, {paper.width(), paper.height()}, {scale, scale}));
+    return darkBox(paper);
 }
 
 TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
@@ -208,11 +208,11 @@ TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
     caption.text = QStringLiteral("שלום Lumora 2024");
     caption.family = QStringLiteral("No Such Family");
     Bitmap paper(200, 60, Qt::white);
-    drawCaption(paper, caption);
-    EXPECT_TRUE(inkOf(paper).isNull());
+    drawInk(paper, inkOf(caption, {200, 60}));
+    EXPECT_TRUE(darkBox(paper).isNull());
     caption.family = QStringLiteral("David");
-    drawCaption(paper, caption);
-    EXPECT_FALSE(inkOf(paper).isNull());
+    drawInk(paper, inkOf(caption, {200, 60}));
+    EXPECT_FALSE(darkBox(paper).isNull());
 }
 
 } // namespace

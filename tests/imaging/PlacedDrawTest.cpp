@@ -154,7 +154,7 @@ TEST(KeyedFrame, MakesBlackTransparentAndDarkPartlySo) {
                           {qRgb(255, 255, 255), {255, 255, 255}}};
     for (const Case& expected : cases) {
         Bitmap paper(8, 8, QColor(200, 150, 100));
-        drawKeyedFrame(paper, Bitmap(4, 4, QColor(expected.frame)));
+        drawKeyedFrame(paper, keyedFrame(Bitmap(4, 4, QColor(expected.frame)), {8, 8}));
         const QRgb found = paper.image().pixel(4, 4);
         EXPECT_NEAR(qRed(found), expected.out[0], 1);
         EXPECT_NEAR(qGreen(found), expected.out[1], 1);
