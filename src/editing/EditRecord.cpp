@@ -17,6 +17,21 @@ QString beforeAnyPicture() {
     return LeftField(QStringLiteral("1   1   1   "), width);
 }
 
+std::int16_t stored(Column column, std::int16_t number) {
+    return Val16(QString::number(number).left(column.width));
+}
+
+QString stored(Column column, const QString& text) {
+    const QString cut = text.left(column.width);
+    qsizetype from = 0;
+    qsizetype to = cut.size();
+    while (from < to && cut[from] == u' ')
+        ++from;
+    while (to > from && cut[to - 1] == u' ')
+        --to;
+    return cut.mid(from, to - from);
+}
+
 } // namespace EditRecord
 
 void UnpackEditState(const QString& record, EditFields& fields) {
@@ -51,7 +66,7 @@ void UnpackEditState(const QString& record, EditFields& fields) {
     fields.TextVertical = number(R::TextVertical);
     fields.TextStyle = number(R::TextStyle);
     fields.TextFont = text(R::TextFont).trimmed();
-    fields.TextBody = text(R::TextBody).trimmed();
+    fields.TextBody = R::stored(R::TextBody, text(R::TextBody));
 }
 
 void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder) {

@@ -51,6 +51,11 @@ inline constexpr Column TextStyle{95, 2};
 inline constexpr Column TextFont{97, 30};
 inline constexpr Column TextBody{127, 70};
 
+// What a field becomes in its column: the right end of what is too long is cut, and of a text the blanks around it are
+// not part, while a line break at its beginning is.
+std::int16_t stored(Column column, std::int16_t number);
+QString stored(Column column, const QString& text);
+
 // The record of a picture that was not edited.
 QString newPicture();
 

@@ -1,5 +1,6 @@
 #include "editing/EditedPicture.h"
 
+#include "editing/EditRecord.h"
 #include "imaging/ColourMatrix.h"
 #include "imaging/Resample.h"
 #include "imaging/Stopwatch.h"
@@ -21,12 +22,14 @@ ColourMatrix coloursOf(const EditFields& edit) {
     return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
 }
 
+// As the record carries it, so that the editor shows no more than what prints.
 PictureCaption captionOf(const EditFields& edit) {
+    namespace R = EditRecord;
     const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
     PictureCaption caption;
-    caption.text = edit.TextBody;
+    caption.text = R::stored(R::TextBody, edit.TextBody);
     caption.family = edit.TextFont;
-    caption.emSize = edit.TextFontSize;
+    caption.emSize = R::stored(R::TextFontSize, edit.TextFontSize);
     caption.bold = (edit.TextStyle & 1) != 0;
     caption.italic = (edit.TextStyle & 2) != 0;
     caption.align = edit.TextAlign == 1   ? PictureCaption::Align::Centre
@@ -34,8 +37,8 @@ PictureCaption captionOf(const EditFields& edit) {
                                           : PictureCaption::Align::Near;
     caption.run = edit.TextVertical == 3 ? PictureCaption::Run::Down : PictureCaption::Run::Across;
     caption.colour = QColor(channel(edit.TextRed), channel(edit.TextGreen), channel(edit.TextBlue));
-    caption.x = edit.TextX;
-    caption.y = edit.TextY;
+    caption.x = R::stored(R::TextX, edit.TextX);
+    caption.y = R::stored(R::TextY, edit.TextY);
     return caption;
 }
 

@@ -97,6 +97,10 @@ void expectOrder(const char* what, const Draw& draw) {
     }
 }
 
+void drawCaption(Bitmap& paper, const PictureCaption& caption, PaperScale scale = {}) {
+    drawInk(paper, inkOf(caption, {paper.width(), paper.height()}, scale));
+}
+
 PictureCaption captionAt(double x, const QString& text) {
     PictureCaption caption;
     caption.text = text;

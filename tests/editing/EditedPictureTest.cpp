@@ -114,6 +114,23 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
     }
 }
 
+TEST_F(EditedPictureTest, theCaptionOfThePreviewIsTheOneThatPrints) {
+    EditFields edit = fieldsOf(EditRecord::newPicture());
+    edit.TextOn = 1;
+    edit.TextFont = QStringLiteral("DejaVu Sans");
+    edit.TextBody = QStringLiteral("  \r\nabc ");
+    edit.TextFontSize = 104; // two digits are kept
+    edit.TextX = 300;
+    edit.TextY = -120; // three characters are kept
+    edit.TextAlign = 2;
+    PackEditState(edit, QStringLiteral("NB"), {});
+    const Bitmap whileTyped = preview("lying.png", edit);
+    EXPECT_EQ(whileTyped.image(), preview("lying.png", fieldsOf(edit.EditState)).image());
+    EXPECT_EQ(fieldsOf(edit.EditState).TextBody, QStringLiteral("\r\nabc")) << "the empty line stays";
+    edit.TextOn = 0;
+    EXPECT_NE(whileTyped.image(), preview("lying.png", edit).image());
+}
+
 TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
     const auto frame = [&](const char* folder, const char* name, FrameUse use) {
         EditFields edit;
