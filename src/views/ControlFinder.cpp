@@ -14,6 +14,9 @@
 #include <QMouseEvent>
 #include <QPlainTextEdit>
 
+#include <algorithm>
+#include <cmath>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -29,17 +32,51 @@ QPoint middleOf(const QWidget& widget) {
     return widget.visibleRegion().boundingRect().center();
 }
 
-void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held) {
-    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), Qt::LeftButton, held,
+void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held,
+           Qt::MouseButton button = Qt::LeftButton) {
+    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), button, held,
                       Qt::NoModifier);
     QApplication::sendEvent(&widget, &event);
 }
 
-void click(QWidget& widget, QPoint at) {
+ControlFinder::Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) {
     const QPointer<QWidget> alive(&widget);
-    mouse(widget, at, QEvent::MouseButtonPress, Qt::LeftButton);
-    if (alive && alive->isVisible())
-        mouse(*alive, at, QEvent::MouseButtonRelease, Qt::NoButton);
+    // A mouse comes from somewhere: what follows it without a press has seen it before the press.
+    if (widget.hasMouseTracking())
+        mouse(widget, at, QEvent::MouseMove, Qt::NoButton, Qt::NoButton);
+    if (alive)
+        mouse(*alive, at, QEvent::MouseButtonPress, button, button);
+    return {alive, at, button};
+}
+
+void letMouseGo(const ControlFinder::Held& held) {
+    if (held.widget && held.widget->isVisible())
+        mouse(*held.widget, held.at, QEvent::MouseButtonRelease, Qt::NoButton, held.button);
+}
+
+void click(QWidget& widget, QPoint at) {
+    letMouseGo(pressDown(widget, at));
+}
+
+QPoint pointOf(const QWidget& widget, QPointF percent) {
+    return {std::clamp(static_cast<int>(std::lround(percent.x() / 100 * widget.width())), 0, widget.width() - 1),
+            std::clamp(static_cast<int>(std::lround(percent.y() / 100 * widget.height())), 0, widget.height() - 1)};
+}
+
+QString unusable(const QWidget& widget) {
+    if (!widget.isVisible() || widget.visibleRegion().isEmpty())
+        return u"hidden"_s;
+    return widget.isEnabled() ? QString() : u"disabled"_s;
+}
+
+QString coveredAt(const QWidget& widget, QPoint at) {
+    QWidget* hit = widget.window()->childAt(widget.mapTo(widget.window(), at));
+    if (hit == &widget || (hit && widget.isAncestorOf(hit)))
+        return {};
+    return hit ? u"covered by %1"_s.arg(hit->objectName().isEmpty()
+                                            ? QString::fromLatin1(hit->metaObject()->className())
+                                            : hit->objectName())
+               : u"outside the window"_s;
 }
 
 void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers modifiers = Qt::NoModifier) {
@@ -62,28 +99,22 @@ QString ControlFinder::frontPage() const {
 }
 
 Result<PageView*> ControlFinder::view(const QString& page) const {
-    if (frontPage() != page)
+    PageView* const below = m_window.viewBelow();
+    const bool inFront = frontPage() == page;
+    if (!inFront && !(below && pageName(below->page().id()) == page))
         return fail(u"the page in front is %1, not %2"_s.arg(frontPage().isEmpty() ? u"none"_s : frontPage(), page));
     m_window.renderNow();
-    return m_window.frontView();
+    return inFront ? m_window.frontView() : below;
 }
 
 QString ControlFinder::whyNotPressable(const QWidget& widget) {
-    if (!widget.isVisible() || widget.visibleRegion().isEmpty())
-        return u"hidden"_s;
-    if (!widget.isEnabled())
-        return u"disabled"_s;
-    const QPoint at = middleOf(widget);
-    QWidget* hit = widget.window()->childAt(widget.mapTo(widget.window(), at));
-    if (hit != &widget && !(hit && widget.isAncestorOf(hit)))
-        return hit ? u"covered by %1"_s.arg(hit->objectName().isEmpty()
-                                                ? QString::fromLatin1(hit->metaObject()->className())
-                                                : hit->objectName())
-                   : u"outside the window"_s;
-    return {};
+    const QString why = unusable(widget);
+    if (!why.isEmpty())
+        return why;
+    return coveredAt(widget, middleOf(widget));
 }
 
-Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& control) const {
+Result<QWidget*> ControlFinder::inSight(const QString& page, const QString& control) const {
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
@@ -91,10 +122,75 @@ Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& co
     QWidget* widget = bound ? bound->widget.data() : (*found)->findChild<QWidget*>(control);
     if (!widget)
         return fail(u"%1 has no control %2 that can be pressed"_s.arg(page, control));
-    const QString why = whyNotPressable(*widget);
+    const QString why = unusable(*widget);
     if (!why.isEmpty())
         return fail(u"%1.%2 is %3"_s.arg(page, control, why));
     return widget;
+}
+
+Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& control) const {
+    const Result<QWidget*> widget = inSight(page, control);
+    if (!widget)
+        return widget.failure();
+    const QString why = whyNotPressable(**widget);
+    if (!why.isEmpty())
+        return fail(u"%1.%2 is %3"_s.arg(page, control, why));
+    return *widget;
+}
+
+Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control) const {
+    const Result<QWidget*> widget = pressable(page, control);
+    if (!widget)
+        return widget.failure();
+    QWidget& hit = target(**widget);
+    return pressDown(hit, middleOf(hit));
+}
+
+Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control, QPointF percent,
+                                                Qt::MouseButton button) const {
+    const Result<QWidget*> found = inSight(page, control);
+    if (!found)
+        return found.failure();
+    QWidget& widget = **found;
+    const QPoint at = pointOf(widget, percent);
+    const QString why = coveredAt(widget, at);
+    if (!why.isEmpty())
+        return fail(u"%1.%2 at %3 %4 is %5"_s.arg(page, control).arg(percent.x()).arg(percent.y()).arg(why));
+    // What lies there inside the control takes the press, as it would a person's.
+    QWidget* inside = widget.childAt(at);
+    QWidget& hit = inside ? *inside : widget;
+    return pressDown(hit, hit.mapFrom(&widget, at), button);
+}
+
+void ControlFinder::letGo(const Held& held) const {
+    letMouseGo(held);
+}
+
+Result<void> ControlFinder::pressAt(const QString& page, const QString& control, QPointF percent,
+                                    Qt::MouseButton button) const {
+    const Result<Held> held = hold(page, control, percent, button);
+    if (!held)
+        return held.failure();
+    letMouseGo(*held);
+    return {};
+}
+
+Result<void> ControlFinder::drag(const QString& page, const QString& control, QPointF from, QPointF to) const {
+    const Result<QWidget*> found = inSight(page, control);
+    if (!found)
+        return found.failure();
+    // The control may move under the mouse; the way is the one that it was at the press.
+    const QPoint begin = (*found)->mapToGlobal(pointOf(**found, from));
+    const QPoint end = (*found)->mapToGlobal(pointOf(**found, to));
+    Result<Held> held = hold(page, control, from, Qt::LeftButton);
+    if (!held)
+        return held.failure();
+    for (int i = 1; i <= dragMoves && held->widget; ++i) {
+        held->at = held->widget->mapFromGlobal(begin + (end - begin) * i / dragMoves);
+        mouse(*held->widget, held->at, QEvent::MouseMove, Qt::LeftButton, Qt::NoButton);
+    }
+    letMouseGo(*held);
+    return {};
 }
 
 Result<void> ControlFinder::press(const QString& page, const QString& control) const {

@@ -3,9 +3,10 @@
 #include "common/Result.h"
 
 #include <QPoint>
+#include <QPointF>
+#include <QPointer>
 #include <QString>
-
-class QWidget;
+#include <QWidget>
 
 namespace lumora {
 
@@ -22,8 +23,23 @@ public:
     // The name of the page in front, "" when there is none.
     QString frontPage() const;
 
-    // Each takes the page's name; a page that is not in front is a failure.
+    // Each takes the page's name; a page that is neither in front nor in sight below a panel is a failure.
     Result<void> press(const QString& page, const QString& control) const;
+    // A mouse that is down on a control, until it is let go. The control may vanish meanwhile.
+    struct Held {
+        QPointer<QWidget> widget;
+        QPoint at;
+        Qt::MouseButton button = Qt::LeftButton;
+    };
+    // Places are in percent of the control's width and height.
+    Result<Held> hold(const QString& page, const QString& control) const;
+    Result<Held> hold(const QString& page, const QString& control, QPointF percent, Qt::MouseButton button) const;
+    void letGo(const Held& held) const;
+    Result<void> pressAt(const QString& page, const QString& control, QPointF percent,
+                         Qt::MouseButton button = Qt::LeftButton) const;
+    // Moves the mouse in dragMoves equal moves, so that what counts moves comes out the same each time.
+    static constexpr int dragMoves = 20;
+    Result<void> drag(const QString& page, const QString& control, QPointF from, QPointF to) const;
     // Replaces what the text box holds.
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
     // The row of a list or of a combo box with this text.
@@ -44,6 +60,7 @@ public:
 
 private:
     Result<PageView*> view(const QString& page) const;
+    Result<QWidget*> inSight(const QString& page, const QString& control) const;
     Result<QWidget*> pressable(const QString& page, const QString& control) const;
 
     MainWindow& m_window;

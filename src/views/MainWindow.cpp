@@ -6,9 +6,12 @@
 #include "views/Overlay.h"
 #include "views/PageView.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QStackedLayout>
 #include <QTimer>
+
+#include <algorithm>
 
 namespace lumora {
 
@@ -43,8 +46,10 @@ PageView* MainWindow::viewOf(const Page& page) const {
 }
 
 void MainWindow::renderNow() {
-    if (m_front)
-        m_front->renderNow();
+    for (PageView* view : {m_below, m_front}) {
+        if (view)
+            view->renderNow();
+    }
 }
 
 PageView* MainWindow::make(Page& page) {
@@ -53,7 +58,13 @@ PageView* MainWindow::make(Page& page) {
         return nullptr;
     PageView* view = maker->second(page, *m_theme).release();
     m_views[&page] = view;
-    m_stack->addWidget(view);
+    if (view->isPanel()) {
+        view->setParent(this);
+        view->hide();
+        view->installEventFilter(this);
+    } else {
+        m_stack->addWidget(view);
+    }
     // The view goes with its page. A signal of one of its widgets may still be on its way back through it.
     connect(&page, &QObject::destroyed, view, [this, view, &page] {
         m_views.erase(&page);
@@ -71,16 +82,49 @@ void MainWindow::pageShown(Page* page) {
 }
 
 void MainWindow::bringToFront(PageView* view) {
-    m_front = view;
+    PageView* const before = std::exchange(m_front, view);
+    PageView* const uncovered = view->isPanel() ? nullptr : std::exchange(m_below, nullptr);
     setWindowTitle(QStringLiteral("Lumora")); // a page with a title of its own sets it as it renders
-    m_stack->setCurrentWidget(view);
     setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
-    view->renderNow();
-    const Overlay* panel = frontOverlay(*this);
-    if (!panel) {
-        if (QWidget* first = view->firstFocus())
-            first->setFocus(Qt::OtherFocusReason);
+    if (before && before != view && before->isPanel())
+        before->hide();
+    if (uncovered)
+        uncovered->setCoveredHeight(0);
+    if (view->isPanel()) {
+        if (!m_below && before != view) {
+            m_below = before;
+            m_focusBelow = QApplication::focusWidget();
+        }
+        view->renderNow();
+        view->show();
+        view->raise();
+        placePanel();
+    } else {
+        m_stack->setCurrentWidget(view);
+        view->renderNow();
     }
+    if (Overlay* box = frontOverlay(*this)) {
+        box->raise();
+        return;
+    }
+    QWidget* first = uncovered == view && m_focusBelow ? m_focusBelow.data() : view->firstFocus();
+    if (first)
+        first->setFocus(Qt::OtherFocusReason);
+}
+
+void MainWindow::placePanel() {
+    if (!m_front || !m_front->isPanel())
+        return;
+    const int wanted = std::min(std::max(m_front->sizeHint().height(), m_front->minimumSizeHint().height()), height());
+    m_front->setGeometry(0, height() - wanted, width(), wanted);
+    if (m_below)
+        m_below->setCoveredHeight(wanted);
+}
+
+bool MainWindow::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() == QEvent::LayoutRequest && watched == m_front)
+        QTimer::singleShot(0, this, &MainWindow::placePanel);
+    return QWidget::eventFilter(watched, event);
 }
 
 void MainWindow::pageUnloaded(Page* page) {
@@ -92,9 +136,12 @@ void MainWindow::pageUnloaded(Page* page) {
     view->hide();
     if (m_front == view)
         m_front = nullptr;
+    if (m_below == view)
+        m_below = nullptr;
 }
 
 void MainWindow::resizeEvent(QResizeEvent*) {
+    placePanel();
     const double factor = Theme::factorFor(size());
     if (factor != m_theme->factor())
         QTimer::singleShot(0, this, &MainWindow::rebuild);
@@ -107,21 +154,24 @@ void MainWindow::rebuild() {
     *m_theme = Theme(factor);
     setStyleSheet(m_theme->styleSheet());
     const Page* front = m_front ? &m_front->page() : nullptr;
+    const Page* below = m_below ? &m_below->page() : nullptr;
     const auto old = std::exchange(m_views, {});
     m_front = nullptr;
+    m_below = nullptr;
     for (const auto& [page, view] : old) {
+        view->hide(); // before it lets go of its page: a button that is held down lets go too
         view->detach();
         m_stack->removeWidget(view);
-        view->hide();
         view->deleteLater();
     }
     for (const auto& [page, view] : old) {
         disconnect(page, &QObject::destroyed, view, nullptr);
-        if (m_chain.find(page->id()) == page) {
-            PageView* fresh = make(*m_chain.find(page->id()));
-            if (page == front)
-                bringToFront(fresh);
-        }
+        if (m_chain.find(page->id()) == page)
+            make(*m_chain.find(page->id()));
+    }
+    for (const Page* page : {below, front}) {
+        if (PageView* fresh = page ? viewOf(*page) : nullptr)
+            bringToFront(fresh);
     }
 }
 

@@ -43,6 +43,7 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     m_headerActions = new QHBoxLayout;
     m_headerActions->setSpacing(theme.px(4));
     headerRow->addLayout(m_headerActions);
+    m_header = header;
     column->addWidget(header);
 
     m_titleBlock = new QWidget(this);
@@ -78,6 +79,7 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     barRow->addStretch(1);
     m_main = section();
     bar->setMinimumHeight(theme.px(58) + theme.px(24) + 2);
+    m_bar = bar;
     column->addWidget(bar);
 }
 
@@ -89,6 +91,12 @@ void PageFrame::setTitle(const QString& title, const QString& subtitle) {
 
 void PageFrame::setTitleVisible(bool visible) {
     m_titleBlock->setVisible(visible);
+}
+
+void PageFrame::showContentOnly() {
+    m_header->hide();
+    m_titleBlock->hide();
+    m_bar->hide();
 }
 
 void PageFrame::addHeaderAction(QWidget* widget) {

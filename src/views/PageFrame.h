@@ -25,6 +25,9 @@ public:
     // The title takes no room, as on a page that needs all its height.
     void setTitleVisible(bool visible);
 
+    // Of a panel: no header, no title, no bottom bar.
+    void showContentOnly();
+
     QVBoxLayout* content() const { return m_content; }
     // Leaving, the language: at the far end of the header.
     void addHeaderAction(QWidget* widget);
@@ -39,6 +42,8 @@ private:
     QLabel* m_title;
     QLabel* m_subtitle;
     QWidget* m_titleBlock;
+    QWidget* m_header;
+    QWidget* m_bar;
     QHBoxLayout* m_headerActions;
     QVBoxLayout* m_content;
     QHBoxLayout* m_main;

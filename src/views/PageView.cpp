@@ -81,6 +81,8 @@ PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
 }
 
 void PageView::start() {
+    if (isPanel())
+        m_frame->showContentOnly();
     m_dirty = true;
     renderNow();
 }
@@ -277,8 +279,7 @@ void PageView::setDirectedIcon(QPushButton* button, bool forwards) {
     if (button->property("directedIcon") == icon)
         return; // a button that is given its icon again paints itself again
     button->setProperty("directedIcon", icon);
-    setIcon(button, icon,
-            button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
+    setIcon(button, icon, button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
 }
 
 void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour) {

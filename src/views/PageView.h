@@ -51,6 +51,11 @@ public:
     // The page is gone or about to go: nothing of it is read from here on.
     void detach();
     bool isDetached() const { return m_detached; }
+    // A panel is docked at the bottom of the window, as high as it wishes, over the view of the page shown before it,
+    // which stays in sight and answers wherever it is not covered. A panel shows its content alone: no header, no bars.
+    virtual bool isPanel() const { return false; }
+    // So many pixels of this view's lower part lie behind a panel; 0 when the panel has gone.
+    virtual void setCoveredHeight(int) {}
     // Esc on the page itself.
     virtual void escape() {}
     // What has the keyboard when the page comes to the front.

@@ -33,6 +33,17 @@ TEST(ScenarioFile, TakesTheArgumentsOfEachCommand) {
     EXPECT_EQ(only("pause 250").seconds, 0.25);
     EXPECT_EQ(only("shot start").text, u"start");
 
+    const ScenarioCommand hold = only("hold tFrmNew.Image2(0) 400 # closer");
+    EXPECT_EQ(hold.verb, ScenarioVerb::Hold);
+    EXPECT_EQ(hold.seconds, 0.4);
+    const ScenarioCommand drag = only("drag tFrmNew.PicPic 50 50 60.5 0");
+    EXPECT_EQ(drag.from, QPointF(50, 50));
+    EXPECT_EQ(drag.to, QPointF(60.5, 0));
+    const ScenarioCommand at = only("press-at RedI.Picture1 12.5 100");
+    EXPECT_EQ(at.from, QPointF(12.5, 100));
+    EXPECT_FALSE(at.rightKey);
+    EXPECT_TRUE(only("press-at RedI.Picture1 1 2 right # the other key").rightKey);
+
     const ScenarioCommand item = only("expect-item kyoskNew.List1 3 121015GNBC:\\\\pics\\\\a b.jpg");
     EXPECT_EQ(item.number, 3);
     EXPECT_EQ(item.text, u"121015GNBC:\\pics\\a b.jpg");
@@ -87,6 +98,14 @@ TEST(ScenarioFile, TellsTheFirstBadLineWithItsNumber) {
         "pick ",
         "shot ../secret",
         "press # nnn.Command1",
+        "hold a.b",
+        "hold a.b soon",
+        "drag a.b 1 2 3",
+        "drag a.b 1 2 3 101",
+        "press-at a.b 10",
+        "press-at a.b 10 -1",
+        "press-at a.b 10 10 left",
+        "press-at a.b 10 10 right right",
     };
     for (const char* line : bad) {
         const auto file = ScenarioFile::parse(QByteArray("# a comment\n\npress nnn.Command1\n") + line + "\nnonsense\n",

@@ -21,6 +21,9 @@ enum class Takes {
     Number,
     Flag,  // 0 or 1
     YesNo, // yes or no
+    From,  // two percentages
+    To,
+    OptionalRight,
     Word,
     Text,     // to the end of the line, may be empty
     SomeText, // the same, but not empty
@@ -35,13 +38,25 @@ struct Grammar {
 
 constexpr double patienceOfPage = 30; // seconds, where the line names none
 
-const std::array<Grammar, 16>& grammars() {
-    static const std::array<Grammar, 16> all{{
+const std::array<Grammar, 19>& grammars() {
+    static const std::array<Grammar, 19> all{{
         {ScenarioVerb::Page,
          "page",
          {Takes::Page, Takes::OptionalSeconds},
          "NAME [SECONDS]: wait until that page is in front"},
         {ScenarioVerb::Press, "press", {Takes::Control}, "PAGE.CONTROL"},
+        {ScenarioVerb::PressAt,
+         "press-at",
+         {Takes::Control, Takes::From, Takes::OptionalRight},
+         "PAGE.CONTROL X Y [right]: percent of its width and height"},
+        {ScenarioVerb::Hold,
+         "hold",
+         {Takes::Control, Takes::Milliseconds},
+         "PAGE.CONTROL MILLISECONDS: press, wait, let go"},
+        {ScenarioVerb::Drag,
+         "drag",
+         {Takes::Control, Takes::From, Takes::To},
+         "PAGE.CONTROL X1 Y1 X2 Y2: in percent, in 20 equal moves"},
         {ScenarioVerb::Type, "type", {Takes::Control, Takes::Text}, "PAGE.CONTROL TEXT: replaces what the box holds"},
         {ScenarioVerb::Choose,
          "choose",
@@ -128,6 +143,17 @@ std::optional<double> numberIn(const QString& word) {
     return ok && std::isfinite(number) && number >= 0 ? std::optional(number) : std::nullopt;
 }
 
+QString takePlace(Rest& rest, QPointF& place) {
+    for (double* side : {&place.rx(), &place.ry()}) {
+        const QString word = rest.word();
+        const std::optional<double> percent = numberIn(word);
+        if (!percent || *percent > 100)
+            return QStringLiteral("a percentage is wanted, not \"%1\"").arg(word);
+        *side = *percent;
+    }
+    return {};
+}
+
 // What is wrong with this argument, or nothing.
 QString take(Takes what, Rest& rest, ScenarioCommand& command) {
     if (what == Takes::Text || what == Takes::SomeText) {
@@ -140,6 +166,11 @@ QString take(Takes what, Rest& rest, ScenarioCommand& command) {
         if (rest.nothingLeft())
             return {};
     }
+
+    if (what == Takes::OptionalRight && rest.nothingLeft())
+        return {};
+    if (what == Takes::From || what == Takes::To)
+        return takePlace(rest, what == Takes::From ? command.from : command.to);
 
     const QString word = rest.word();
     if (word.isEmpty() || word.startsWith(u'#'))
@@ -183,6 +214,11 @@ QString take(Takes what, Rest& rest, ScenarioCommand& command) {
             return QStringLiteral("%1 or %2 is wanted, not \"%3\"").arg(on, off, word);
         return {};
     }
+    case Takes::OptionalRight:
+        command.rightKey = true;
+        return word == u"right" ? QString() : QStringLiteral("right or nothing is wanted, not \"%1\"").arg(word);
+    case Takes::From:
+    case Takes::To:
     case Takes::Text:
     case Takes::SomeText:
         break;

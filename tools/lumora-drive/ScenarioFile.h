@@ -3,6 +3,7 @@
 #include "common/Result.h"
 
 #include <QByteArray>
+#include <QPointF>
 #include <QString>
 
 #include <vector>
@@ -12,6 +13,9 @@ namespace lumora {
 enum class ScenarioVerb {
     Page,
     Press,
+    PressAt,
+    Hold,
+    Drag,
     Type,
     Choose,
     Tick,
@@ -33,11 +37,13 @@ struct ScenarioCommand {
     int line = 0; // of the file, from 1
     ScenarioVerb verb = ScenarioVerb::Page;
     QString page;
-    QString control;    // "Command12", "Image1(0)"
-    QString text;       // with its line breaks; also the path of pick and dump and the name of a shot
-    double seconds = 0; // page, until, pause
-    int number = 0;     // expect-count, expect-item
-    bool yes = false;   // tick, answer, expect-visible
+    QString control;       // "Command12", "Image1(0)"
+    QString text;          // with its line breaks; also the path of pick and dump and the name of a shot
+    double seconds = 0;    // page, until, pause, hold
+    int number = 0;        // expect-count, expect-item
+    bool yes = false;      // tick, answer, expect-visible
+    QPointF from, to;      // press-at (from alone), drag: percent of the control's width and height
+    bool rightKey = false; // press-at: of the mouse
 };
 
 // A text file that says what a customer does at the pages and what must be seen there: one command a line, blank lines

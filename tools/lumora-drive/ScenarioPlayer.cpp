@@ -15,6 +15,8 @@
 #include <QPixmap>
 #include <QSaveFile>
 
+#include <cmath>
+
 namespace lumora {
 
 namespace {
@@ -24,7 +26,8 @@ constexpr double patienceOfMessage = 5; // seconds: a box may come from a timer 
 constexpr double patienceOfWork = 900;  // seconds until work that does not come to rest has failed
 
 bool touches(ScenarioVerb verb) {
-    return verb == ScenarioVerb::Press || verb == ScenarioVerb::Type || verb == ScenarioVerb::Choose ||
+    return verb == ScenarioVerb::Press || verb == ScenarioVerb::PressAt || verb == ScenarioVerb::Hold ||
+           verb == ScenarioVerb::Drag || verb == ScenarioVerb::Type || verb == ScenarioVerb::Choose ||
            verb == ScenarioVerb::Tick;
 }
 
@@ -55,6 +58,9 @@ ScenarioPlayer::ScenarioPlayer(Program& program, std::vector<ScenarioFile> files
     m_program.dialogs().nextAnswer = [this] { return takeAnswer(); };
     m_timer.setInterval(betweenSteps);
     connect(&m_timer, &QTimer::timeout, this, &ScenarioPlayer::step);
+    m_letGo.setSingleShot(true);
+    m_letGo.setTimerType(Qt::PreciseTimer);
+    connect(&m_letGo, &QTimer::timeout, this, &ScenarioPlayer::letGo);
     m_atThisLine.start();
 }
 
@@ -63,7 +69,7 @@ void ScenarioPlayer::step() {
         ++m_file;
         m_command = 0;
     }
-    if (m_finished)
+    if (m_finished || m_held)
         return;
     const bool busy = m_program.platform().pump.pumping();
     if (m_file == m_files.size()) {
@@ -120,17 +126,41 @@ void ScenarioPlayer::touch(const ScenarioCommand& command) {
 
     m_program.dialogs().closeMessages();
     m_program.window().renderNow();
-    Result<void> touched;
-    if (command.verb == ScenarioVerb::Press)
-        touched = m_controls.press(command.page, command.control);
-    else if (command.verb == ScenarioVerb::Type)
-        touched = m_controls.type(command.page, command.control, command.text);
-    else if (command.verb == ScenarioVerb::Choose)
-        touched = m_controls.choose(command.page, command.control, command.text);
-    else
-        touched = m_controls.tick(command.page, command.control, command.yes);
+    const Result<void> touched = use(command);
     if (!touched)
         fail(here, QStringLiteral("%1.%2 in reach").arg(command.page, command.control), touched.failure().message);
+}
+
+Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
+    const QString& page = command.page;
+    const QString& control = command.control;
+    switch (command.verb) {
+    case ScenarioVerb::PressAt:
+        return m_controls.pressAt(page, control, command.from, command.rightKey ? Qt::RightButton : Qt::LeftButton);
+    case ScenarioVerb::Drag:
+        return m_controls.drag(page, control, command.from, command.to);
+    case ScenarioVerb::Type:
+        return m_controls.type(page, control, command.text);
+    case ScenarioVerb::Choose:
+        return m_controls.choose(page, control, command.text);
+    case ScenarioVerb::Tick:
+        return m_controls.tick(page, control, command.yes);
+    case ScenarioVerb::Hold: {
+        const Result<ControlFinder::Held> held = m_controls.hold(page, control);
+        if (!held)
+            return held.failure();
+        m_held = *held;
+        m_letGo.start(static_cast<int>(std::lround(command.seconds * 1000)));
+        return {};
+    }
+    default:
+        return m_controls.press(page, control);
+    }
+}
+
+void ScenarioPlayer::letGo() {
+    if (const auto held = std::exchange(m_held, std::nullopt))
+        m_controls.letGo(*held);
 }
 
 ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
@@ -176,6 +206,9 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
         m_answers += command.yes;
         return {true, {}, {}};
     case ScenarioVerb::Press:
+    case ScenarioVerb::PressAt:
+    case ScenarioVerb::Hold:
+    case ScenarioVerb::Drag:
     case ScenarioVerb::Type:
     case ScenarioVerb::Choose:
     case ScenarioVerb::Tick:

@@ -51,6 +51,8 @@ private:
     void step();
     bool mayRunNow(ScenarioVerb verb) const;
     void touch(const ScenarioCommand& command);
+    Result<void> use(const ScenarioCommand& command);
+    void letGo();
     Look look(const ScenarioCommand& command);
     Look lookForMessage(const QString& wanted);
     Look waitForPause(double seconds) const;
@@ -74,6 +76,8 @@ private:
     std::size_t m_file = 0;
     std::size_t m_command = 0;
     QElapsedTimer m_atThisLine;
+    std::optional<ControlFinder::Held> m_held;
+    QTimer m_letGo;
     bool m_goesOnInTheMiddle = false;
     bool m_finished = false;
     qsizetype m_messagesTaken = 0; // of ScreenDialogs::shownTexts

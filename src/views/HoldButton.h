@@ -1,0 +1,37 @@
+#pragma once
+
+#include <QPushButton>
+
+#include <functional>
+
+namespace lumora {
+
+// A button that works as long as it is held. The page's own timer does the work: down() starts it, up() ends it, also
+// when the pointer or the keyboard leaves the button, or the button is hidden or disabled under it. Ahead of up() comes
+// tap() when the button was let go and not taken away: there the page makes up for a timer that has not ticked yet, so
+// that a tap is one step.
+class HoldButton : public QPushButton {
+    Q_OBJECT
+public:
+    struct Handlers {
+        std::function<void()> down;
+        std::function<void()> tap;
+        std::function<void()> up;
+    };
+    HoldButton(Handlers handlers, QWidget* parent);
+
+    bool isHeld() const { return m_held; }
+
+protected:
+    void changeEvent(QEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
+
+private:
+    enum class End { LetGo, Lost };
+    void end(End how);
+
+    Handlers m_handlers;
+    bool m_held = false;
+};
+
+} // namespace lumora
