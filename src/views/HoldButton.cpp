@@ -30,6 +30,12 @@ void HoldButton::changeEvent(QEvent* event) {
     QPushButton::changeEvent(event);
 }
 
+// A button that is disabled or hidden loses the keyboard first.
+void HoldButton::focusOutEvent(QFocusEvent* event) {
+    end(End::Lost);
+    QPushButton::focusOutEvent(event);
+}
+
 void HoldButton::hideEvent(QHideEvent* event) {
     end(End::Lost);
     QPushButton::hideEvent(event);

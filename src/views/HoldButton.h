@@ -24,6 +24,7 @@ public:
 
 protected:
     void changeEvent(QEvent* event) override;
+    void focusOutEvent(QFocusEvent* event) override;
     void hideEvent(QHideEvent* event) override;
 
 private:

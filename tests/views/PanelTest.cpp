@@ -22,7 +22,7 @@ namespace {
 struct PanelPage : Page {
     PanelPage()
         : Page(PageId::SpltForm) {}
-    Caption Command1{u"Close"_s};
+    Caption Command1{.text = u"Close"_s, .hint = {}};
     int presses = 0;
 };
 
