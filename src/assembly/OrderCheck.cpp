@@ -1,8 +1,8 @@
 #include "assembly/OrderCheck.h"
 
+#include "assembly/OrderItem.h"
 #include "assembly/OrderTail.h"
 #include "assembly/PrintFileName.h"
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "common/ListOutput.h"
 #include "imaging/PictureFile.h"
@@ -19,9 +19,6 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-constexpr int codeWidth = 9;
-constexpr int editRecordWidth = 200;
-
 // What the log of an order says, of either print form and of the album form.
 struct ReadLog {
     QString order;
@@ -34,7 +31,9 @@ struct ReadLog {
     QStringList items;
     bool edited = false;
 
-    QString path(const QString& item) const { return item.mid(edited ? codeWidth + editRecordWidth : codeWidth); }
+    OrderItem split(const QString& item) const {
+        return OrderItem::split(item, edited ? OrderItem::Form::Edited : OrderItem::Form::Plain);
+    }
 };
 
 ReadLog readLog(const QByteArray& bytes) {
@@ -182,8 +181,8 @@ private:
         // The place in the order has four digits only, so that several lines may be meant.
         bool found = false;
         for (qsizetype i = parts->index; i < m_log.items.size() && !found; i += 10000) {
-            const QString& item = m_log.items[i];
-            found = item.left(codeWidth) == parts->code && PrintBaseName(m_log.path(item)) == parts->baseName;
+            const OrderItem item = m_log.split(m_log.items[i]);
+            found = item.code == parts->code && PrintBaseName(item.path) == parts->baseName;
             if (found)
                 m_made.insert(static_cast<int>(i), name);
         }
@@ -198,12 +197,12 @@ private:
 
     void checkEveryItemIsThere() {
         for (qsizetype i = 0; i < m_log.items.size(); ++i) {
-            const QString path = m_log.path(m_log.items[i]);
-            const bool excused = LeafName(path).size() < 5 || m_log.failed.contains(path);
+            const OrderItem item = m_log.split(m_log.items[i]);
+            const bool excused = !item.hasUsableName() || m_log.failed.contains(item.path);
             if (!m_made.contains(static_cast<int>(i)) && !excused)
                 fault(QStringLiteral("line %1 of the basket (%2) has no print file and is not named as failed")
                           .arg(i)
-                          .arg(path));
+                          .arg(item.path));
         }
     }
 

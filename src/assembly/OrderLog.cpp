@@ -74,6 +74,15 @@ void writeAlbumHead(ListOutput& log, const SessionState& state, const QDateTime&
         log.pair(QStringLiteral("Tosafot2_%1").arg(i), album.Tosafot2[i - 1]);
 }
 
+void writeStars(ListOutput& log) {
+    log.pair(QStringLiteral("***"), stars);
+}
+
+void writeItems(ListOutput& log, const QStringList& items) {
+    for (const QString& item : items)
+        log.pair(QStringLiteral("Shoora"), item);
+}
+
 void writeTail(ListOutput& log, const QStringList& items, const QStringList& failed) {
     const auto blank = [&log] { log.text(QStringLiteral(" ")).endLine(); };
     log.pair(QStringLiteral("-----------Total Failed"), QString::number(failed.size()) + QString(11, u'-'));
@@ -85,8 +94,7 @@ void writeTail(ListOutput& log, const QStringList& items, const QStringList& fai
     blank();
     log.pair(QString(11, u'-'), QString(30, u'-'));
     blank();
-    for (const QString& item : items)
-        log.pair(QStringLiteral("Shoora"), item);
+    writeItems(log, items);
 }
 
 } // namespace
@@ -99,8 +107,30 @@ QByteArray plainOrderLog(const SessionState& state, const QStringList& items, co
     else
         writePrintHead(log, state, now);
     log.text(QStringLiteral("More Comp = ")).number(state.DchisaAmoka).endLine();
-    log.pair(QStringLiteral("***"), stars);
+    writeStars(log);
     writeTail(log, items, failed);
+    return log.bytes();
+}
+
+// The kind of order is always told as 5, whatever the session holds: the lab's reader of this form knows no other.
+QByteArray editedOrderLog(const SessionState& state, const QStringList& items, const QStringList& failed,
+                          const QDateTime& now) {
+    ListOutput log;
+    log.pair(QStringLiteral("KeSherLaSharat = "), QString::number(state.transfer.KeSherLaSharat));
+    log.pair(QStringLiteral("HitKasherDerech = "), state.transfer.HitKasherDerech);
+    log.text(QStringLiteral("TaooyotBaHaShvaa = ")).number(state.transfer.TaooyotBaHaShvaa).endLine();
+    log.pair(QStringLiteral("00"), QStringLiteral("00"));
+    log.pair(QStringLiteral("Shemot.Girsa"), state.shemot.Girsa);
+    log.text(QStringLiteral("Time")).date(now).endLine();
+    log.pair(QStringLiteral("Hazmana"), orderName(state));
+    log.pair(QStringLiteral("Option"), QStringLiteral("5"));
+    writeDetails(log, state.shemot);
+    writeStars(log);
+    log.pair(QStringLiteral("***"), QStringLiteral("****    Failed    ***************************"));
+    for (const QString& path : failed)
+        log.pair(QStringLiteral("Failed  "), path);
+    writeStars(log);
+    writeItems(log, items);
     return log.bytes();
 }
 

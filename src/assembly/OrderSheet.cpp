@@ -51,28 +51,54 @@ void drawTextLine(QPainter& painter, int x, int top, const QString& text) {
     painter.drawText(QPoint(x, top + painter.fontMetrics().ascent()), text);
 }
 
-// Where the prints are fetched, by the way in which the order came. The places are those of the lab's branches.
-QString plainDeliveryLine(const QString& kodMishloach) {
-    struct Place {
-        const char16_t* code;
-        const char16_t* place;
-    };
-    static constexpr std::array<Place, 3> places = {{
-        {u"KIN", u"קבלת תמונות בקניון"},
-        {u"LOB", u"קבלת תמונות בלובי"},
-        {u"NSM", u"קבלת תמונות בסניף"},
-    }};
-    for (const Place& place : places) {
+struct DeliveryPlace {
+    const char16_t* code;
+    const char16_t* line;
+};
+
+// Where the prints are fetched, by the way in which the order came; the two kinds of order know different ways. The
+// places are those of the lab's branches.
+constexpr std::array<DeliveryPlace, 3> plainPlaces = {{
+    {u"KIN", u"קבלת תמונות בקניון"},
+    {u"LOB", u"קבלת תמונות בלובי"},
+    {u"NSM", u"קבלת תמונות בסניף"},
+}};
+constexpr std::array<DeliveryPlace, 3> editedPlaces = {{
+    {u"HOM", u"קבלת תמונות בדואר"},
+    {u"KNN", u"קבלת תמונות בקניון"},
+    {u"PLZ", u"קבלת תמונות בפלאזה"},
+}};
+
+QString deliveryLine(const std::array<DeliveryPlace, 3>& places, const QString& kodMishloach) {
+    for (const DeliveryPlace& place : places) {
         if (kodMishloach.left(3) == QString::fromUtf16(place.code))
-            return QString::fromUtf16(place.place);
+            return QString::fromUtf16(place.line);
     }
     return {};
 }
 
-QString topLine(const SessionState& state, const QDateTime& now) {
+QString topLine(const SessionState& state, const QDateTime& now, const QString& delivery) {
     return QStringLiteral("No.....") + state.MisparHazmana + u'_' + state.shemot.ser + QStringLiteral("    ") +
-           now.toString(QStringLiteral("dd/MM/yyyy HH:mm:ss")) + QStringLiteral("     ") +
-           plainDeliveryLine(state.KodMishloach) + QStringLiteral(" ver: ") + state.shemot.Girsa;
+           now.toString(QStringLiteral("dd/MM/yyyy HH:mm:ss")) + QStringLiteral("     ") + delivery +
+           QStringLiteral(" ver: ") + state.shemot.Girsa;
+}
+
+QString plainTopLine(const SessionState& state, const QDateTime& now) {
+    return topLine(state, now, deliveryLine(plainPlaces, state.KodMishloach));
+}
+
+QString customerLine(const OrderDetails& shemot) {
+    return QStringLiteral("  Name....") + shemot.n1 + QStringLiteral("        Tel.....") + shemot.n2 +
+           QStringLiteral("      ") + shemot.n4;
+}
+
+QString addressLine(const OrderDetails& shemot) {
+    return QStringLiteral("    ") + shemot.n3 + QStringLiteral("      ");
+}
+
+QString totalLine(const OrderDetails& shemot, const QString& beforeMail) {
+    return QStringLiteral("  Total pictures...") + QString::number(shemot.TotalPics) + QStringLiteral("   Border=  ") +
+           shemot.Bord + beforeMail + QStringLiteral("Mail  ") + shemot.Mail;
 }
 
 } // namespace
@@ -97,16 +123,22 @@ QStringList plainSheetLines(const SessionState& state, const QDateTime& now) {
                               ? shemot.ppr + QStringLiteral("   paper  Kind") + shemot.Soog2 + u' ' + shemot.Soog1
                               : QStringLiteral("  Paper size....") + shemot.ppr + QStringLiteral("       paper  Kind") +
                                     shemot.maat + QStringLiteral("    ") + shemot.FillFit;
-    return {
-        topLine(state, now),
-        QStringLiteral("  Name....") + shemot.n1 + QStringLiteral("        Tel.....") + shemot.n2 +
-            QStringLiteral("      ") + shemot.n4,
-        QStringLiteral("    ") + shemot.n3 + QStringLiteral("      "),
-        paper,
-        QStringLiteral("  Total pictures...") + QString::number(shemot.TotalPics) + QStringLiteral("   Border=  ") +
-            shemot.Bord + QStringLiteral("   Mail  ") + shemot.Mail,
-        shemot.Hearot,
-    };
+    return {plainTopLine(state, now),
+            customerLine(shemot),
+            addressLine(shemot),
+            paper,
+            totalLine(shemot, QStringLiteral("   ")),
+            shemot.Hearot};
+}
+
+QStringList editedSheetLines(const SessionState& state, const QDateTime& now) {
+    const OrderDetails& shemot = state.shemot;
+    return {topLine(state, now, deliveryLine(editedPlaces, state.KodMishloach) + u' '),
+            customerLine(shemot),
+            addressLine(shemot),
+            QStringLiteral("  Paper size....") + shemot.ppr + QStringLiteral("       paper Kind  ") + shemot.maat,
+            totalLine(shemot, QStringLiteral("     ")),
+            QStringLiteral("  ") + shemot.Hearot};
 }
 
 QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
@@ -115,7 +147,7 @@ QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
     const QString gap(7, u' ');
     const auto& extras = album.Tosafot2;
     return {
-        topLine(state, now),
+        plainTopLine(state, now),
         QStringLiteral("  ShemZalam....") + album.ShemZalam + QStringLiteral("        TelZalam.....") + album.TelZalam +
             QStringLiteral("      ") + state.shemot.n4,
         // No line break behind the event: the address goes on beside it.

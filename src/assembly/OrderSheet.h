@@ -26,8 +26,9 @@ PictureSize orderSheetSize(SheetKind kind, int items);
 
 QColor orderSheetBackground(SheetKind kind, const SessionState& state);
 
-// The lines of text from the top, blanks included. The edited order's lines are not among them yet.
+// The lines of text from the top, blanks included.
 QStringList plainSheetLines(const SessionState& state, const QDateTime& now);
+QStringList editedSheetLines(const SessionState& state, const QDateTime& now);
 QStringList albumSheetLines(const SessionState& state, const QDateTime& now);
 
 // A picture of the contact sheet and the text below it. A cell without a source stays empty.

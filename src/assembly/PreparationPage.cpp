@@ -1,0 +1,210 @@
+#include "assembly/PreparationPage.h"
+
+#include "common/FixedText.h"
+#include "platform/Dialogs.h"
+#include "platform/Files.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <utility>
+
+namespace lumora {
+
+PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain)
+    : Page(id)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain) {}
+
+QString PreparationPage::doNotDelete(const SessionState& state) {
+    return state.wording(QStringLiteral("אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת"),
+                         QStringLiteral("If you mean to delete the pictures from the computer, the camera or any other "
+                                        "medium,"));
+}
+
+QString PreparationPage::untilPrinted(const SessionState& state) {
+    return state.wording(QStringLiteral("אל תמחק אותם עד אשר תקבל את התמונות מודפסות"),
+                         QStringLiteral("do not delete them until you hold the printed pictures in your hands"));
+}
+
+bool PreparationPage::takeLines() {
+    List1.append(std::exchange(m_state.handOver.lines, {}));
+    return std::exchange(m_state.handOver.pressStart, false);
+}
+
+void PreparationPage::CountTotalPics() {
+    double total = 0;
+    for (const QString& item : List1.items()) {
+        if (item.right(3) != QLatin1String("txt"))
+            total += Val(item.left(2));
+    }
+    m_state.shemot.TotalPics = HoldIn16Bits(total);
+    Label5.text = QString::number(m_state.shemot.TotalPics);
+}
+
+bool PreparationPage::somethingChosen() {
+    if (!List1.isEmpty())
+        return true;
+    setStage(Stage::Waiting);
+    tell(QStringLiteral("לא נבחרו תמונות"), QStringLiteral("No pictures were chosen"));
+    return false;
+}
+
+void PreparationPage::setPreparing(bool on) {
+    preparing = on;
+    Q_EMIT changed();
+}
+
+void PreparationPage::setStage(Stage stage, int position) {
+    m_stage = stage;
+    progressValue = position;
+    progressMaximum = List1.count();
+    if (stage != Stage::Pictures)
+        Label4Picture.text.clear();
+    showProgress();
+    Q_EMIT changed();
+}
+
+void PreparationPage::showProgress() {
+    const QString position = QString::number(progressValue);
+    const QString count = QString::number(progressMaximum);
+    Label16.text = count;
+    Label17.text = m_stage == Stage::Pictures ? position : QString();
+    switch (m_stage) {
+    case Stage::Waiting:
+        Label4Progress.text =
+            m_state.wording(QStringLiteral("ההזמנה עוד לא הוכנה"), QStringLiteral("The order is not prepared yet"));
+        break;
+    case Stage::Checking:
+        Label4Progress.text =
+            m_state.wording(QStringLiteral("בודק את רשימת התמונות"), QStringLiteral("Checking the list of pictures"));
+        break;
+    case Stage::Sheet:
+        Label4Progress.text = m_state
+                                  .wording(QStringLiteral("מצייר את דף ההזמנה: תמונה %1 מתוך %2"),
+                                           QStringLiteral("Drawing the order sheet: picture %1 of %2"))
+                                  .arg(position, count);
+        break;
+    case Stage::Pictures:
+        Label4Progress.text = m_state
+                                  .wording(QStringLiteral("מכין תמונה מספר %1 מתוך %2 תמונות שבחרת"),
+                                           QStringLiteral("Preparing picture %1 of the %2 that you chose"))
+                                  .arg(position, count);
+        break;
+    case Stage::Closing:
+        Label4Progress.text =
+            m_state.wording(QStringLiteral("רושם את פרטי ההזמנה"), QStringLiteral("Writing down the order's details"));
+        break;
+    case Stage::Done:
+        Label4Progress.text = m_state.wording(QStringLiteral("ההזמנה מוכנה"), QStringLiteral("The order is ready"));
+        break;
+    }
+    Label4fail.visible = !List4fail.isEmpty();
+    Label4fail.text = m_state
+                          .wording(QStringLiteral("%1 תמונות לא ניתן היה להכין:"),
+                                   QStringLiteral("Pictures that could not be prepared: %1"))
+                          .arg(List4fail.count());
+}
+
+void PreparationPage::addFailed(const QString& path) {
+    List4fail.append(path);
+    showProgress();
+    Q_EMIT changed();
+}
+
+bool PreparationPage::openFolder(const OrderFolder& folder) {
+    m_state.transfer.OrderFolder = folder.path();
+    const Result<void> made = makeOrderFolder(m_state, m_platform.files, folder);
+    if (!made)
+        tell(QStringLiteral("לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."),
+             QStringLiteral("The order's folder can't be made. Free some space or mend the rights, then try again."),
+             made.failure().message);
+    return made.ok();
+}
+
+bool PreparationPage::forEachPicture(const std::function<void(int)>& step) {
+    for (int i = 0; i < List1.count(); ++i) {
+        List1.setCurrentIndex(i);
+        setStage(Stage::Pictures, i + 1);
+        step(i);
+        if (!yield())
+            return false;
+    }
+    if (m_writeFailures > 1)
+        tell(QStringLiteral("%1 קבצים של ההזמנה לא נכתבו.").arg(m_writeFailures),
+             QStringLiteral("%1 files of the order could not be written.").arg(m_writeFailures));
+    return true;
+}
+
+bool PreparationPage::pack(PrintPacker& packer, const PrintPacker::Line& line,
+                           const std::function<Result<QByteArray>()>& picture) {
+    const PrintPacker::Outcome outcome = packer.pack(line, picture);
+    if (!outcome.packed)
+        addFailed(line.path);
+    if (outcome.writeFailure)
+        tellWriteFailure(*outcome.writeFailure);
+    return outcome.packed;
+}
+
+// On a full disk every picture fails in the same way: the first is told at once, the others in one sum at the end.
+void PreparationPage::tellWriteFailure(const Failure& failure) {
+    if (m_writeFailures++ == 0)
+        tell(QStringLiteral("קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."),
+             QStringLiteral("A file of the order could not be written. What was prepared so far is kept."),
+             failure.message);
+}
+
+void PreparationPage::countOrder() {
+    if (const Result<void> counted = Workspace(m_state, m_platform.files).writeCounter(); !counted)
+        tell(QStringLiteral("מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."),
+             QStringLiteral("The number of the next order could not be stored. This order goes on."),
+             counted.failure().message);
+}
+
+bool PreparationPage::writeLog(const OrderFolder& folder, const QByteArray& log) {
+    if (const Result<void> logged = m_platform.files.writeWhole(folder.logPath(), log); !logged) {
+        tell(QStringLiteral("לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."),
+             QStringLiteral(
+                 "The order's details can't be written, so the order was not sent. What was prepared is kept. "
+                 "Put it right, then try again."),
+             logged.failure().message);
+        return false;
+    }
+    m_state.transfer.OrderLogBase = folder.logBase();
+    return true;
+}
+
+void PreparationPage::handOver(std::optional<PageId> next) {
+    m_handedOver = true;
+    m_state.transfer.SugMishloah = 0;
+    const QString prepared = m_state
+                                 .wording(QStringLiteral("הזמנה מספר %1 מוכנה ונשמרה בתחנה."),
+                                          QStringLiteral("Order number %1 is ready and kept at this station."))
+                                 .arg(m_state.MisparHazmana);
+    if (!next) {
+        m_state.handOver.notice = prepared;
+    } else if (!m_chain.isRegistered(*next)) {
+        tell(QStringLiteral("ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."),
+             QStringLiteral("The order is ready, but this version has no page to go on with it."),
+             m_state.transfer.OrderFolder);
+        m_state.handOver.notice = prepared;
+    } else {
+        m_chain.show(*next);
+    }
+    m_chain.unload(id());
+}
+
+void PreparationPage::tell(const QString& hebrew, const QString& english, const QString& reason) {
+    const QString text = m_state.wording(hebrew, english);
+    m_platform.dialogs.message(reason.isEmpty() ? text : text + u'\n' + reason);
+}
+
+bool PreparationPage::yield() {
+    m_platform.pump.pump();
+    return !m_chain.hasEnded();
+}
+
+} // namespace lumora

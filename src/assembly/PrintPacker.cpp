@@ -1,0 +1,54 @@
+#include "assembly/PrintPacker.h"
+
+#include "assembly/PrintFileName.h"
+#include "platform/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <utility>
+
+namespace lumora {
+
+PrintPacker::PrintPacker(const SessionState& state, const Files& files, OrderFolder folder, int tailForm)
+    : m_state(state)
+    , m_files(files)
+    , m_folder(std::move(folder))
+    , m_tail(OrderTail::of(state))
+    , m_shape(PrintFileShape::of(state.profile))
+    , m_scratch(WorkspacePaths::scratchPicture(state))
+    , m_tailForm(tailForm) {}
+
+void PrintPacker::beginStep() {
+    m_folderThere = makeOrderFolder(m_state, m_files, m_folder);
+}
+
+PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Result<QByteArray>()>& picture) {
+    if (const Result<void> gone = m_files.fileExists(m_scratch) ? m_files.removeFile(m_scratch) : Result<void>();
+        !gone) {
+        static_cast<void>(picture()); // one that is made ahead must not wait for the next step
+        return {false, gone.failure()};
+    }
+    const Result<QByteArray> made = picture();
+    if (!made)
+        return {};
+    if (const Result<void> written = m_files.writeWhole(m_scratch, *made); !written)
+        return {false, written.failure()};
+
+    const QString base = PrintBaseName(line.path);
+    m_manifestLine = QString::number(made->size()) + QStringLiteral(">>") + line.code +
+                     QString::number(m_runningNumber) + u'_' + base + QStringLiteral(".jpg\r\n");
+    if (!m_folderThere)
+        return {false, m_folderThere.failure()};
+    const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));
+    const QString name = PrintFileName{line.code, line.index, m_state.Optint, base}.text();
+    const Result<void> written =
+        packed ? m_files.writeWhole(m_folder.printFilePath(name), *packed) : Result<void>(packed.failure());
+    return written ? Outcome{true, {}} : Outcome{false, written.failure()};
+}
+
+void PrintPacker::removeScratch() const {
+    if (m_files.fileExists(m_scratch))
+        static_cast<void>(m_files.removeFile(m_scratch));
+}
+
+} // namespace lumora

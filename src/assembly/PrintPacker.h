@@ -1,0 +1,66 @@
+#pragma once
+
+#include "assembly/OrderFolder.h"
+#include "assembly/OrderTail.h"
+#include "assembly/PrintFile.h"
+#include "common/Result.h"
+
+#include <QByteArray>
+#include <QString>
+
+#include <functional>
+#include <optional>
+
+namespace lumora {
+
+class Files;
+struct SessionState;
+
+// Puts the prints of one order into its folder, one print file a line of the basket. Every print passes through the
+// scratch file first. The tail is made once: it has the totals of the whole order.
+class PrintPacker {
+public:
+    // tailForm: as SugTzad, 40 or 60 bytes, any other value none.
+    PrintPacker(const SessionState& state, const Files& files, OrderFolder folder, int tailForm);
+
+    const OrderFolder& folder() const { return m_folder; }
+
+    // Begins a step: sees to it that the folder is there. A failure comes out of pack().
+    void beginStep();
+
+    struct Line {
+        int index; // in the basket, from 0
+        QString code;
+        QString path;
+    };
+    struct Outcome {
+        bool packed = false;
+        // Set where a file of the order could not be written: a picture that can't be read is its own fault.
+        std::optional<Failure> writeFailure;
+    };
+    // The scratch picture of the step before goes, picture() is made and becomes the scratch picture, and its print
+    // file is written. Where nothing could be made there is no scratch picture either, so that no picture is ever
+    // printed as the one before it.
+    Outcome pack(const Line& line, const std::function<Result<QByteArray>()>& picture);
+
+    // Takes the scratch picture away.
+    void removeScratch() const;
+    const QString& scratch() const { return m_scratch; }
+
+    // What a manifest would tell of the step in work: length, code, running number, name.
+    const QString& manifestLine() const { return m_manifestLine; }
+
+private:
+    const SessionState& m_state;
+    const Files& m_files;
+    const OrderFolder m_folder;
+    const OrderTail m_tail;
+    const PrintFileShape m_shape;
+    const QString m_scratch;
+    const int m_tailForm;
+    Result<void> m_folderThere;
+    QString m_manifestLine;
+    int m_runningNumber = 1;
+};
+
+} // namespace lumora
