@@ -117,8 +117,9 @@ void NewContent::append(const char* bytes, std::size_t count) {
     }
 }
 
-Result<void> NewContent::commit() {
-    if (m_error == 0 && ::fsync(m_file.number()) != 0)
+Result<void> NewContent::commit(Durability durability) {
+    const bool synced = durability == Durability::Synced;
+    if (synced && m_error == 0 && ::fsync(m_file.number()) != 0)
         m_error = errno;
     if (m_error == 0 && m_file.close() != 0)
         m_error = errno;
@@ -127,6 +128,8 @@ Result<void> NewContent::commit() {
     if (m_error != 0)
         return systemFailure(m_error, m_path);
     m_temporary.clear();
+    if (!synced)
+        return {};
     // The new name is not on the disk before its folder is; where a file system has no such call the file itself is
     // still whole.
     const Descriptor folder(::open(m_target.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));

@@ -50,8 +50,9 @@ public:
     void append(const char* bytes, std::size_t count);
     bool failed() const { return m_error != 0; }
 
-    // Syncs and renames.
-    Result<void> commit();
+    // Syncs and renames. A passing file, which is of no use after a crash, need not wait for the disk.
+    enum class Durability { Synced, Passing };
+    Result<void> commit(Durability durability = Durability::Synced);
 
 private:
     std::filesystem::path m_target;
