@@ -17,6 +17,8 @@ public:
     // Top left, bottom left, top right, and the one that follows.
     enum class Corner { Picture11, Picture9, Picture10, Picture14 };
 
+    static constexpr int step = 6; // of widening and narrowing, a side
+
     bool visible = false;
 
     QPoint marker(Corner corner) const;

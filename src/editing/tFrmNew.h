@@ -1,6 +1,5 @@
 #pragma once
 
-#include "common/Result.h"
 #include "editing/CropFrame.h"
 #include "editing/DragHandle.h"
 #include "editing/FrameLists.h"
@@ -8,6 +7,7 @@
 #include "editing/TextLabelPlace.h"
 #include "imaging/Bitmap.h"
 #include "imaging/PictureFile.h"
+#include "platform/HostPath.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"
@@ -45,6 +45,10 @@ public:
     void setTexts() override;
 
     // --- events ---
+
+    // How many real pixels a logical pixel of the paper has on this screen, 1 to 3. Best told before a picture is
+    // opened: no more pixels are read of it than the scale asks for.
+    void setPreviewScale(double scale);
 
     // Pressed by other pages.
     void Command17_Click(); // opens the picture of the session's edit fields
@@ -97,7 +101,7 @@ public:
     void Timer8_Tick(); // up and down
     // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
     void tickOnceIfNone();
-    // The pointer was lost or the page went: the button in hand is let go as by its MouseUp.
+    // The pointer was lost or the page went: what is in hand is let go as by its MouseUp.
     void stopHolds();
 
     // Dragging the picture. Positions may lie outside the paper.
@@ -145,9 +149,12 @@ public:
 
     // --- state ---
 
-    Bitmap PicPic;          // what the paper shows; null before a picture was opened
+    Bitmap PicPic;          // what the paper shows, in the scale that was asked for; null while no picture is open
     PictureSize PicPicSize; // the paper in logical pixels
-    bool pictureOpen() const;
+    // The view that the page of pictures keeps, in logical pixels, as preview and record have it. Null if nothing was
+    // drawn since it was taken.
+    Bitmap takeSmallView();
+    bool pictureOpen() const { return m_open; }
 
     // The box that marks the caption, in logical pixels of the paper. Its text is blanks that give its length.
     TextLabelBox LabeltextBox;
@@ -190,85 +197,90 @@ public:
     Caption Command10, Command12, Command23, Command24; // the paper sizes
     Caption Command13, Command14, Command15, Command16; // the crop markers
 
+    bool hintsAsLabels = false; // Image29: a pointer that can't hover reads the hints below the buttons
+
     static constexpr int holdMilliseconds = 50;
-    // How long the last tick of a held button took to draw and store, for whoever wants to know.
-    double lastTickMilliseconds = 0;
 
 Q_SIGNALS:
     // The record of the session is to be kept: the page of pictures listens.
     void stored();
-    // What the paper shows now, in logical pixels.
-    void painted(const lumora::Bitmap& preview);
     // The customer goes back to the pictures.
     void left();
+    // The customer picked a picture by its file, to see all pictures of its folder.
+    void picked(const QString& path);
 
 private:
     enum class Tone { Grey, Sepia, Blue, Green };
 
-    void hidePanels();
-    BigPics& surfaces() const;
-    EditedPreview* preview() const;
     EditFields& edit() const;
+    BigPics& surfaces() const;
+    EditedPreview* workPicture() const;
+    HostPath hostOf(const QString& path) const;
+    void tell(const QString& hebrew, const QString& english, const QString& reason) const;
+    void hidePanels();
 
     void ResetEditorZoom();
+    void OpenPictureInEditor();
     bool LoadWorkBitmap(const QString& path);
-    bool loadOpenPicture();
+    bool loadPictureOfRecord();
     void writeWorkFile();
-    void putHandle(double x, double y);
+    void putHandle(QPointF position);
+    void handleToFields();
     void PackEditState();
     void RenderPreview();
-    void show(const EditFields& fields);
+    Bitmap drawn(const EditFields& fields);
     void StoreCurrentEdit();
     void UndoAllEdits();
-    void showNumbers();
-    void setGains(float red, float green, float blue);
-    void takeTone(Tone tone);
-    void renderPackStore();
+    // The two patterns that most controls follow.
     void packRenderStore();
+    void renderPackStore();
 
     void hold(Ticker& ticker, int step);
+    void dropHold();
     void endHold();
-    void brightnessReleased();
     void zoomReleased();
-    void panBy(int x, int y);
+    void panBy(QPointF distance);
     void setTurn(std::int16_t code);
+    void setGains(float red, float green, float blue);
+    void takeTone(Tone tone);
 
     void fillFrames(FrameLists::ListFile kind);
     void fillFramesIfEmpty();
     void takeFrame();
-    void showFrameNumber();
-    void setLineStyle(int index);
-    const std::optional<Bitmap>& frame();
+    void stepLineStyle(int step);
+    QChar lineFrameLetter() const;
+    const std::optional<Bitmap>& frame(const EditFields& fields);
     void PlaceTextLabel();
-    void tellOnce(bool& told, const Failure& failure);
-    void setHints();
+    void showNumbers();
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     FrameLists m_frames;
 
-    DragHandle Image3; // PanX and PanY, with fractions
-    DragHandle m_label;
+    DragHandle Image3; // unseen: its place is PanX and PanY, with fractions
+    DragHandle m_labelHandle;
     DragHandle m_cropHandle;
     CropFrame::Corner m_cropCorner = CropFrame::Corner::Picture11;
     Ticker Timer2, Timer3, Timer6, Timer7, Timer8;
     Ticker* m_held = nullptr;
-    int m_step = 0; // of the held button
+    int m_step = 0; // of the held button, a tick
     int m_ticks = 0;
-    bool m_opened = false;
+    bool m_open = false;
+    unsigned m_openings = 0;
+    bool m_workFileFailed = false;
+    bool m_drawnSinceTaken = false;
+    double m_scale = 1;
 
     QString PaperSizeCode = QStringLiteral("1015");
     std::int16_t PreviewZoom = 100;
     QString FrameColorLetter;
     QString FrameStyleDigits;
-    bool m_hints = true;
 
-    // The frame of the last drawing, by folder and name: it is read once and not at each tick.
+    // The frame that was drawn last, by folder and name: it is read once and not at each tick.
     QString m_frameKey;
     std::optional<Bitmap> m_frame;
     mutable std::map<QString, Bitmap> m_framePictures;
-    bool m_workFileTold = false;
 };
 
 } // namespace lumora

@@ -87,6 +87,15 @@ void collectInto(QStringList& all, const HostPath& folder, const QString& shown,
     }
 }
 
+Result<void> write(const Result<HostPath>& host, const QString& path, const QByteArray& bytes,
+                   NewContent::Durability durability) {
+    if (!host)
+        return host.failure();
+    NewContent content(*host, path);
+    content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
+    return content.commit(durability);
+}
+
 } // namespace
 
 Result<HostPath> Files::host(const QString& path) const {
@@ -149,12 +158,11 @@ Result<QByteArray> Files::read(const QString& path) const {
 }
 
 Result<void> Files::writeWhole(const QString& path, const QByteArray& bytes) const {
-    const auto found = host(path);
-    if (!found)
-        return found.failure();
-    NewContent content(*found, path);
-    content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
-    return content.commit();
+    return write(host(path), path, bytes, NewContent::Durability::Synced);
+}
+
+Result<void> Files::writePassing(const QString& path, const QByteArray& bytes) const {
+    return write(host(path), path, bytes, NewContent::Durability::Passing);
 }
 
 Result<void> Files::copyFile(const QString& source, const QString& target) const {

@@ -33,6 +33,10 @@ public:
     // new one and never half a file.
     Result<void> writeWhole(const QString& path, const QByteArray& bytes) const;
 
+    // The same without waiting for the disk: for files that are written at every touch and that nothing needs after a
+    // crash of the machine.
+    Result<void> writePassing(const QString& path, const QByteArray& bytes) const;
+
     // Copies whole, in the same way. The source is opened for reading only.
     Result<void> copyFile(const QString& source, const QString& target) const;
 

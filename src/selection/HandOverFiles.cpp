@@ -22,10 +22,10 @@ Result<void> HandOverFiles::write(const QStringList& lines, int index) const {
     for (const QString& line : lines)
         all += line + QStringLiteral("\r\n");
     if (const Result<void> written =
-            m_files.writeWhole(JoinDrivePath(folder, QStringLiteral("all_list.txt")), AnsiCodePage::encode(all));
+            m_files.writePassing(JoinDrivePath(folder, QStringLiteral("all_list.txt")), AnsiCodePage::encode(all));
         !written)
         return written;
-    return m_files.writeWhole(JoinDrivePath(folder, onePicName(index)),
+    return m_files.writePassing(JoinDrivePath(folder, onePicName(index)),
                               AnsiCodePage::encode(lines.value(index) + QStringLiteral("\r\n")));
 }
 

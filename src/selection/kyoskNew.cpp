@@ -24,6 +24,8 @@ bool kyoskNew::plain() const {
 }
 
 void kyoskNew::load() {
+    // Nothing of the last picture of an order before.
+    UnpackEditState(EditRecord::newPicture(), m_state.edit);
     m_state.edit.PicturePath.clear();
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
     m_state.BranchChoice.clear();
@@ -42,6 +44,8 @@ void kyoskNew::load() {
 
     clearCells();
     SumCopies();
+    if (!plain())
+        loadEditor();
 }
 
 void kyoskNew::takeFocus(const QString& box) {

@@ -18,6 +18,7 @@ namespace lumora {
 class PageChain;
 struct Platform;
 struct SessionState;
+class tFrmNew;
 
 // The page on which pictures are found, graded, counted and handed on. Twelve cells show a page of small pictures; a
 // click chooses one, plus and minus count its copies. Clicks may arrive while the small pictures are drawn: a redraw
@@ -68,9 +69,8 @@ public:
     void Command11_Click(); // drops duplicate lines
 
     // Called by the editor.
-    void EditorPainted(const Bitmap& preview); // what its preview shows now
-    void Command5_Click();                     // stores the small view of the picture in the editor
-    void ZZvvA_Click();                        // stores the edit record into the basket
+    void Command5_Click(); // stores the small view of the picture in the editor
+    void ZZvvA_Click();    // stores the edit record into the basket
 
     // Leaving.
     void Image10_Click();   // ends the program; asks first when pictures were chosen
@@ -228,7 +228,11 @@ private:
     void AddSimple(int cell);
     void AddForEditor(int cell);
     void AddWholeFolderLine(int index);
+    tFrmNew* editor() const;
+    void loadEditor();
     void openInEditor(int cell);
+    void leaveEditor();
+    void showFolderOf(const QString& picture);
     // What plus and minus share: the copies are written to the cell and to the line.
     void setCopies(int cell, int copies);
     int copiesOfCell(int cell) const { return Val16(Label4[static_cast<std::size_t>(cell)].text); }
@@ -267,7 +271,7 @@ private:
     Guide m_guide = Guide::None;
     PrintGrade m_grade = PrintGrade::Unmarked; // what Label6 tells, and of which size
     PictureSize m_gradedSize;
-    Bitmap m_editorPreview;
+    bool m_handOverFailed = false; // told once, and not at each touch
 };
 
 } // namespace lumora

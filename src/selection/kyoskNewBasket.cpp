@@ -2,6 +2,7 @@
 #include "common/DrivePathText.h"
 #include "editing/EditRecord.h"
 #include "editing/StoredSmallView.h"
+#include "editing/tFrmNew.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "selection/HandOverFiles.h"
@@ -84,13 +85,36 @@ void kyoskNew::AddForEditor(int cell) {
     SumCopies();
 }
 
-void kyoskNew::openInEditor(int cell) {
+tFrmNew* kyoskNew::editor() const {
+    return static_cast<tFrmNew*>(m_chain.find(PageId::tFrmNew));
+}
+
+// Once an order, with this page.
+void kyoskNew::loadEditor() {
     if (!m_chain.isRegistered(PageId::tFrmNew))
         return;
+    m_chain.load(PageId::tFrmNew);
+    connect(editor(), &tFrmNew::stored, this, &kyoskNew::ZZvvA_Click);
+    connect(editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);
+    connect(editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
+}
+
+void kyoskNew::openInEditor(int cell) {
+    if (editor() == nullptr)
+        return;
     setKeysPlain();
+    editor()->Command17_Click();
+    if (!editor()->pictureOpen())
+        return; // it was told; the picture stays in the basket as it was
     Command13[static_cast<std::size_t>(cell)].colour = KeyColour::Orange;
     editorView.visible = true;
-    m_chain.load(PageId::tFrmNew);
+    m_chain.show(PageId::tFrmNew);
+}
+
+void kyoskNew::leaveEditor() {
+    Command5_Click();
+    repaintStored(m_state.edit.PicturePath);
+    Q_EMIT changed();
 }
 
 void kyoskNew::Command12_Click(int cell) {
@@ -192,16 +216,13 @@ void kyoskNew::Command23_Click() {
     Q_EMIT changed();
 }
 
-void kyoskNew::EditorPainted(const Bitmap& preview) {
-    m_editorPreview = preview;
-}
-
 void kyoskNew::Command5_Click() {
-    if (m_state.edit.PicturePath.trimmed().isEmpty() || m_editorPreview.isNull())
+    if (m_state.edit.PicturePath.trimmed().isEmpty() || editor() == nullptr)
         return;
-    const Result<void> stored =
-        StoredSmallView::store(m_state, m_platform.files, m_state.edit.PicturePath, m_editorPreview);
-    m_editorPreview = Bitmap(); // it belongs to this picture alone
+    const Bitmap preview = editor()->takeSmallView();
+    if (preview.isNull())
+        return; // what was stored last still holds
+    const Result<void> stored = StoredSmallView::store(m_state, m_platform.files, m_state.edit.PicturePath, preview);
     if (!stored)
         m_platform.dialogs.message(stored.failure().message);
 }
@@ -216,10 +237,14 @@ void kyoskNew::ZZvvA_Click() {
     List1.replaceAt(index, BasketLine{code, m_state.edit.EditState, path}.compose(List1.form()));
     SumCopies();
     const Result<void> written = HandOverFiles(m_state, m_platform.files).write(List1.lines().items(), index);
-    if (!written)
+    if (!written && !m_handOverFailed)
         m_platform.dialogs.message(written.failure().message);
-    repaintStored(path);
-    Q_EMIT changed();
+    m_handOverFailed = !written;
+    // Behind the editor the small picture waits until the customer comes back.
+    if (m_chain.front() == this) {
+        repaintStored(path);
+        Q_EMIT changed();
+    }
 }
 
 } // namespace lumora

@@ -115,6 +115,10 @@ void kyoskNew::pickFolder() {
             drawPage();
         return;
     }
+    showFolderOf(picture);
+}
+
+void kyoskNew::showFolderOf(const QString& picture) {
     takeFolderOf(picture);
     if (List4.isEmpty())
         return;

@@ -243,6 +243,9 @@ bool kyoskNew::handTo(PageId next) {
     m_state.handOver.pressStart = next == PageId::Form2;
     if (!m_chain.show(next))
         return false;
+    // The next order begins with an editor of its own.
+    for (const PageId id : {PageId::mikledet, PageId::RedI, PageId::Form3, PageId::tFrmNew, PageId::BigPics})
+        m_chain.unload(id);
     m_chain.unload(PageId::kyoskNew);
     return true;
 }

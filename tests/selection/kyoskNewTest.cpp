@@ -1,8 +1,10 @@
 #include "selection/kyoskNew.h"
 
 #include "common/DrivePathText.h"
+#include "editing/BigPics.h"
 #include "editing/EditRecord.h"
 #include "editing/StoredSmallView.h"
+#include "editing/tFrmNew.h"
 #include "imaging/PictureFile.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -38,6 +40,13 @@ protected:
     void registerNext(PageId id) {
         chain.registerPage(id, [id] { return std::make_unique<NextPage>(id); });
     }
+
+    void registerEditor() {
+        chain.registerPage(PageId::tFrmNew,
+                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
+    }
+    tFrmNew& editor() { return static_cast<tFrmNew&>(chain.load(PageId::tFrmNew)); }
 
     // count small pictures "01.jpg", ... in a folder; the folder is made.
     void makePictures(const QString& folder, int count, PictureSize size = {40, 30}) {
@@ -283,24 +292,64 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
 
 TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAnew) {
     state.Optint = 2;
-    registerNext(PageId::tFrmNew);
+    registerEditor();
     kyoskNew& page = openWith(3);
     page.Picture1_Click(0);
+    EXPECT_EQ(chain.front(), &editor());
     EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::Orange);
     EXPECT_TRUE(page.editorView.visible);
-    page.EditorPainted(Bitmap(60, 40, Qt::blue));
-    page.Picture1_Click(1); // leaves the first
-    EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::System);
+    EXPECT_EQ(page.List1.item(0).mid(9 + 12, 14), QStringLiteral("180100225 150 "));
+    editor().Image4_Click(); // grey
+    editor().CommandDone_Click();
+    EXPECT_EQ(chain.front(), &page);
     ASSERT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    const auto redAt = [&](std::size_t cell) { return page.Picture1[cell].bitmap.image().pixelColor(50, 30).red(); };
+    EXPECT_LT(redAt(0), 100);
+    EXPECT_GT(redAt(1), 200);
+    page.Picture1_Click(1);
+    EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::System);
     page.Image15_Click();
-    EXPECT_GT(page.Picture1[0].bitmap.image().pixelColor(50, 30).blue(), 200);
-    EXPECT_GT(page.Picture1[1].bitmap.image().pixelColor(50, 30).red(), 200);
+    EXPECT_LT(redAt(0), 100);
+    EXPECT_GT(redAt(1), 200);
 
     page.Command13_Click(0);
     page.Picture1_Click(0);
     EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
     page.Command13_Click(0);
     EXPECT_FALSE(page.editorView.visible);
+}
+
+TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
+    state.Optint = 2;
+    registerEditor();
+    kyoskNew& page = openWith(2);
+    ASSERT_TRUE(machine.files.writeWhole(first, "no picture"));
+    page.Picture1_Click(0);
+    EXPECT_EQ(chain.front(), &page);
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_EQ(page.List1.item(0), QStringLiteral("1 1015GNB") + EditRecord::newPicture() + first);
+    page.Picture1_Click(1);
+    EXPECT_EQ(chain.front(), &editor());
+    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
+}
+
+TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
+    state.Optint = 2;
+    registerEditor();
+    registerNext(PageId::B3);
+    kyoskNew& page = openWith(1);
+    page.Picture1_Click(0);
+    editor().Image15_Click();
+    editor().CommandDone_Click();
+    page.Image7_Click();
+    page.Command7_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::B3);
+    EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 3), QStringLiteral("270"));
+    EXPECT_EQ(chain.find(PageId::tFrmNew), nullptr);
+    EXPECT_EQ(chain.find(PageId::BigPics), nullptr);
+    // A further order begins without the record of this one.
+    chain.show(PageId::kyoskNew);
+    EXPECT_EQ(state.edit.RotationCode, 180);
 }
 
 TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {

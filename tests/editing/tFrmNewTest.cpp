@@ -1,0 +1,633 @@
+#include "editing/tFrmNew.h"
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "editing/BigPics.h"
+#include "editing/EditRecord.h"
+#include "editing/EditedPicture.h"
+#include "editing/mikledet.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+
+namespace lumora {
+namespace {
+
+const QString lying = QStringLiteral("C:\\p\\lying.jpg");
+const QString standing = QStringLiteral("C:\\p\\standing.jpg");
+
+class TheEditor : public testing::Test {
+protected:
+    TheEditor()
+        : chain(machine.pump) {
+        state.DiskRoot = QStringLiteral("C:\\");
+        state.Optint = 2;
+        state.shemot.ppr = QStringLiteral("10/15");
+        state.shemot.Bord = QStringLiteral("NB");
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
+        EXPECT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\p")));
+        savePicture(lying, {400, 300}, Qt::red);
+        savePicture(standing, {300, 400}, Qt::red);
+        chain.registerPage(PageId::tFrmNew,
+                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
+        chain.registerPage(PageId::mikledet,
+                           [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
+        chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
+    }
+
+    HostPath host(const QString& path) const { return *machine.drives.toHost(path); }
+    void savePicture(const QString& path, PictureSize size, QColor colour) {
+        EXPECT_TRUE(saveJpeg(Bitmap(size.width, size.height, colour), host(path), 95));
+    }
+    // A frame of the preview with the list files that the categories are read by.
+    void makeFrame(const QString& category, const QString& name, QColor colour) {
+        const QString folder = JoinDrivePath(WorkspacePaths::misgarot(state), category);
+        EXPECT_TRUE(machine.files.makeFolder(folder));
+        for (const QString& leaf :
+             {u'k' + name + QStringLiteral(".bmp"), name + QStringLiteral(".bmp"), name + QStringLiteral(".png")})
+            EXPECT_TRUE(Bitmap(30, 20, colour).image().save(toText(host(JoinDrivePath(folder, leaf)))));
+    }
+
+    // The page, its stores recorded.
+    tFrmNew& page() {
+        auto* made = static_cast<tFrmNew*>(chain.find(PageId::tFrmNew));
+        if (made == nullptr) {
+            made = static_cast<tFrmNew*>(&chain.load(PageId::tFrmNew));
+            QObject::connect(made, &tFrmNew::stored, [this] { stored += state.edit.EditState; });
+        }
+        return *made;
+    }
+    tFrmNew& open(const QString& picture, const QString& record = EditRecord::newPicture()) {
+        tFrmNew& editor = page();
+        chain.show(PageId::tFrmNew);
+        UnpackEditState(record, state.edit);
+        state.edit.PicturePath = picture;
+        editor.Command17_Click();
+        stored.clear();
+        return editor;
+    }
+    static QString recordWith(EditRecord::Column column, const QString& value) {
+        return EditRecord::newPicture().replace(column.position - 1, column.width, LeftField(value, column.width));
+    }
+    QString field(EditRecord::Column column) const {
+        return state.edit.EditState.mid(column.position - 1, column.width);
+    }
+    QColor middle() { return page().PicPic.image().pixelColor(page().PicPic.width() / 2, page().PicPic.height() / 2); }
+    QColor corner() { return page().PicPic.image().pixelColor(2, 2); }
+
+    // A button held for so many ticks.
+    static void held(const std::function<void()>& down, const std::function<void()>& tick,
+                     const std::function<void()>& up, int ticks) {
+        down();
+        for (int i = 0; i < ticks; ++i)
+            tick();
+        up();
+    }
+    void holdImage2(int index, int ticks) {
+        const bool zoom = index < 2;
+        held([&] { page().Image2_MouseDown(index); }, [&] { zoom ? page().Timer2_Tick() : page().Timer3_Tick(); },
+             [&] { page().Image2_MouseUp(index); }, ticks);
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+    QStringList stored;
+};
+
+TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
+    page();
+    EXPECT_TRUE(stored.isEmpty());
+    tFrmNew& editor = open(lying);
+    EXPECT_EQ(state.edit.EditState, LeftField(QStringLiteral("1   1   1   180100225 150 0  0  000000000000          "
+                                                             "8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "),
+                                              200));
+    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
+    EXPECT_EQ(editor.PicPic.width(), 450);
+    EXPECT_GT(middle().red(), 240);
+    EXPECT_TRUE(editor.Picture3.visible);
+    EXPECT_FALSE(editor.Image19.visible);
+    EXPECT_EQ(*readPictureSize(host(QStringLiteral("C:\\2000lumora\\0.bmp"))), (PictureSize{500, 375}));
+
+    // 780 is a position, 781 is none.
+    for (const auto& [pan, expected] : {std::pair(780, 780), std::pair(781, 225)}) {
+        open(lying, recordWith(EditRecord::PanX, QString::number(pan)).replace(22, 4, QStringLiteral("20  ")));
+        EXPECT_EQ(state.edit.PanX, expected);
+        EXPECT_EQ(state.edit.PanY, expected == 780 ? 20 : 150);
+    }
+}
+
+TEST_F(TheEditor, countsTheTicksOfItsHeldButtonsIntoTheRecord) {
+    tFrmNew& editor = open(lying);
+    holdImage2(0, 25);
+    held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 15);
+    held([&] { editor.Image135_MouseDown(); }, [&] { editor.Timer7_Tick(); }, [&] { editor.Image135_MouseUp(); }, 10);
+    held([&] { editor.Image125_MouseDown(); }, [&] { editor.Timer8_Tick(); }, [&] { editor.Image125_MouseUp(); }, 5);
+    EXPECT_EQ(stored.last().mid(12, 14), QStringLiteral("195150245 140 "));
+
+    chain.unload(PageId::tFrmNew);
+    state.shemot.ppr = QStringLiteral("13/18");
+    tFrmNew& second = open(standing);
+    EXPECT_EQ(second.PicPicSize, (PictureSize{300, 415}));
+    holdImage2(1, 10);
+    second.Image15_Click();
+    held([&] { second.Image115_MouseDown(); }, [&] { second.Timer7_Tick(); }, [&] { second.Image115_MouseUp(); }, 10);
+    held([&] { second.Image145_MouseDown(); }, [&] { second.Timer8_Tick(); }, [&] { second.Image145_MouseUp(); }, 5);
+    EXPECT_EQ(stored.last().mid(12, 14), QStringLiteral("27080 130 217 "));
+}
+
+TEST_F(TheEditor, storesAGainByItsFirstFourCharacters) {
+    enum class By { Red, Blue, Lighter, Darker };
+    struct Case {
+        By by;
+        int steps;
+        const char* stored;
+    };
+    for (const Case& c : {Case{By::Red, 1, "1.06"}, Case{By::Red, 5, "1.3 "}, Case{By::Red, 9, "1.53"},
+                          Case{By::Red, 17, "2.01"}, Case{By::Blue, 10, "0.4 "}, Case{By::Blue, 15, "0.09"},
+                          Case{By::Blue, 17, "-0.0"}, Case{By::Blue, 19, "-0.1"}, Case{By::Lighter, 14, "1.55"},
+                          Case{By::Lighter, 25, "1.99"}, Case{By::Darker, 3, "0.87"}, Case{By::Darker, 25, "-0.0"}}) {
+        tFrmNew& editor = open(lying);
+        if (c.by == By::Red || c.by == By::Blue) {
+            for (int i = 0; i < c.steps; ++i)
+                editor.Image2_Click(c.by == By::Red ? 6 : 10);
+        } else {
+            holdImage2(c.by == By::Lighter ? 4 : 3, c.steps);
+        }
+        EXPECT_EQ(stored.last().left(4), QString::fromLatin1(c.stored)) << c.steps;
+    }
+    open(lying);
+    holdImage2(4, 5);
+    page().Image2_Click(6);
+    page().Image2_Click(8);
+    EXPECT_EQ(stored.last().left(12), QStringLiteral("1.2 1.2 1.2 "));
+}
+
+TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
+    tFrmNew& editor = open(lying);
+    editor.Image2_MouseDown(0);
+    editor.Timer2_Tick();
+    editor.Timer2_Tick();
+    EXPECT_EQ(state.edit.ZoomPercent, 104);
+    EXPECT_EQ(editor.Label11.text, QStringLiteral("104"));
+    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("100"));
+    EXPECT_TRUE(stored.isEmpty());
+    editor.Image2_MouseUp(0);
+    ASSERT_EQ(stored.size(), 1);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("104"));
+
+    editor.Image2_MouseDown(4);
+    editor.Timer3_Tick();
+    EXPECT_EQ(field(EditRecord::GainR), QStringLiteral("1.04"));
+    EXPECT_EQ(stored.size(), 1);
+    editor.Image2_MouseUp(4);
+    EXPECT_EQ(stored.size(), 2);
+
+    editor.Image135_MouseDown();
+    editor.Timer7_Tick();
+    EXPECT_EQ(stored.size(), 3);
+    editor.Image135_MouseUp();
+    EXPECT_EQ(stored.size(), 3);
+    editor.Image11_Click(); // a tone stores before and behind the drawing
+    EXPECT_EQ(stored.size(), 5);
+    editor.Misgerett_Click(false);
+    EXPECT_EQ(stored.size(), 5);
+
+    state.edit.TextOn = 1;
+    state.edit.TextBody = QStringLiteral("abc");
+    state.edit.TextX = state.edit.TextY = 100;
+    editor.Command11_Click();
+    ASSERT_EQ(stored.size(), 6);
+    editor.Labeltext_MouseDown({110, 110});
+    editor.Labeltext_MouseMove({149, 97});
+    EXPECT_EQ(state.edit.TextX, 100);
+    editor.Labeltext_MouseUp();
+    EXPECT_EQ(state.edit.TextX, 103);
+    EXPECT_EQ(state.edit.TextY, 99);
+    ASSERT_EQ(stored.size(), 7);
+    EXPECT_EQ(stored[6], stored[5]); // the place waits for the next pack
+    editor.Command5_Click();
+    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("103"));
+}
+
+TEST_F(TheEditor, holdsItsNumbersWithinTheirRanges) {
+    tFrmNew& editor = open(lying);
+    holdImage2(0, 80);
+    EXPECT_EQ(state.edit.ZoomPercent, 210);
+    holdImage2(1, 120);
+    EXPECT_EQ(state.edit.ZoomPercent, 40);
+    editor.VScrollZ_Change(500);
+    EXPECT_EQ(editor.VScrollZ, 210);
+    EXPECT_EQ(state.edit.ZoomPercent, 40);
+
+    state.edit.RotationCode = 500;
+    editor.Image15_Click();
+    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("230"));
+    editor.Image18_Click();
+    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("500"));
+    state.edit.RotationCode = 540;
+    held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 1);
+    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("180"));
+    held([&] { editor.Image17_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image17_MouseUp(); }, 3);
+    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("177"));
+    editor.Image27_Click();
+    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("180"));
+
+    state.edit.PanX = 32767;
+    open(lying, recordWith(EditRecord::PanX, QStringLiteral("780")).replace(22, 4, QStringLiteral("-999")));
+    state.edit.PanY = -999;
+    held([&] { page().Image125_MouseDown(); }, [&] { page().Timer8_Tick(); }, [&] { page().Image125_MouseUp(); }, 1);
+    EXPECT_EQ(state.edit.PanY, -1001);
+    EXPECT_EQ(field(EditRecord::PanY), QStringLiteral("-100"));
+}
+
+TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
+    tFrmNew& editor = open(lying);
+    editor.Image13_MouseMove();
+    EXPECT_TRUE(editor.Frame3.visible);
+    editor.PicPic_MouseDown({100, 100});
+    for (int i = 0; i < 3; ++i)
+        editor.PicPic_MouseMove({107, 100 - 13.0 / 6});
+    EXPECT_FALSE(editor.Frame3.visible);
+    EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
+    editor.PicPic_MouseUp();
+    editor.PicPic_MouseMove({300, 300});
+    EXPECT_EQ(stored.last().mid(18, 8), QStringLiteral("227 150 ")); // 226.6, and 149.5 to the even one
+    ASSERT_EQ(stored.size(), 1);
+
+    editor.Command8_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::mikledet);
+    editor.PicPic_MouseDown({0, 0});
+    editor.PicPic_MouseMove({200, 200});
+    editor.PicPic_MouseUp();
+    EXPECT_EQ(state.edit.PanX, 227);
+}
+
+TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) {
+    tFrmNew& editor = open(lying);
+    editor.Image2_MouseDown(0);
+    editor.Timer2_Tick();
+    EXPECT_EQ(editor.sunkImage2, 0);
+    editor.stopHolds();
+    EXPECT_EQ(editor.sunkImage2, -1);
+    ASSERT_EQ(stored.size(), 1);
+    EXPECT_EQ(stored[0].mid(15, 3), QStringLiteral("102"));
+    editor.Timer2_Tick(); // one that was under way
+    EXPECT_EQ(state.edit.ZoomPercent, 102);
+
+    // A press shorter than a tick counts as one; a longer one is left alone.
+    editor.Image2_MouseDown(0);
+    editor.tickOnceIfNone();
+    editor.tickOnceIfNone();
+    editor.Image2_MouseUp(0);
+    EXPECT_EQ(state.edit.ZoomPercent, 104);
+
+    editor.Image2_MouseDown(0);
+    editor.Timer2_Tick();
+    open(standing);
+    editor.Image2_MouseUp(0);
+    EXPECT_EQ(state.edit.ZoomPercent, 100);
+    EXPECT_TRUE(stored.isEmpty());
+
+    // Another picture that comes while the release lets events through keeps its own zoom.
+    editor.Image2_MouseDown(0);
+    editor.Timer2_Tick();
+    machine.pump.onPump = [&] { open(lying); };
+    editor.Image2_MouseUp(0);
+    EXPECT_EQ(state.edit.ZoomPercent, 100);
+    EXPECT_TRUE(stored.isEmpty());
+}
+
+TEST_F(TheEditor, greysThePictureOnceWhateverTonesFollow) {
+    tFrmNew& editor = open(lying);
+    struct Case {
+        void (tFrmNew::*press)();
+        QColor colour;
+        const char* gains;
+    };
+    const std::array<Case, 4> cases = {Case{&tFrmNew::Image11_Click, QColor(99, 76, 60), "1.3 1   0.8 "},
+                                       Case{&tFrmNew::Image4_Click, QColor(76, 76, 76), "1   1   1   "},
+                                       Case{&tFrmNew::Image12_Click, QColor(76, 76, 99), "1   1   1.3 "},
+                                       Case{&tFrmNew::Image9_Click, QColor(76, 99, 76), "1   1.3 1   "}};
+    const auto near = [](QColor a, QColor b) {
+        return std::abs(a.red() - b.red()) < 4 && std::abs(a.green() - b.green()) < 4 &&
+               std::abs(a.blue() - b.blue()) < 4;
+    };
+    for (const Case& c : cases) {
+        (editor.*c.press)();
+        EXPECT_TRUE(near(middle(), c.colour)) << c.gains;
+        EXPECT_EQ(stored.last().left(12), QString::fromLatin1(c.gains));
+    }
+    const QString sepia = recordWith(EditRecord::ToneFlag, QStringLiteral("1")).replace(0, 4, QStringLiteral("1.3 "));
+    open(lying, sepia);
+    EXPECT_TRUE(near(middle(), QColor(99, 76, 76)));
+    editor.Image4_Click();
+    EXPECT_TRUE(near(middle(), QColor(76, 76, 76)));
+    editor.Image5_Click();
+    EXPECT_GT(middle().red(), 240);
+    EXPECT_EQ(field(EditRecord::ToneFlag), QStringLiteral("0  "));
+}
+
+TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
+    const QString copy = JoinDrivePath(WorkspacePaths::tempred(state), MangleFileName(lying));
+    ASSERT_TRUE(Bitmap(400, 300, Qt::blue).image().save(toText(host(copy)), "BMP"));
+    const QString before = recordWith(EditRecord::RedMarker, QStringLiteral("RED"))
+                               .replace(32, 3, QStringLiteral("017"))
+                               .replace(126, 4, QStringLiteral("Dana"));
+    tFrmNew& editor = open(lying, before);
+    EXPECT_GT(middle().blue(), 240);
+    editor.Image4_Click();
+    editor.Image15_Click();
+    holdImage2(0, 10);
+    editor.Command10_Click(); // 13/18, from the next load on
+    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
+    editor.Image2_Click(5);
+    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 325}));
+    EXPECT_EQ(stored.last().left(44), QStringLiteral("1   1   1   180100225 162 0  0  017000RED000"));
+    EXPECT_EQ(field(EditRecord::TextBody).trimmed(), QStringLiteral("Dana"));
+    EXPECT_GT(middle().blue(), 240);
+
+    // Back to colour shows the customer's own file, and the record keeps its marker.
+    editor.Image5_Click();
+    EXPECT_GT(middle().red(), 240);
+    EXPECT_EQ(field(EditRecord::RedMarker), QStringLiteral("RED"));
+
+    // A corrected copy that is gone leaves the picture without it.
+    ASSERT_TRUE(machine.files.removeFile(copy));
+    open(lying, before);
+    EXPECT_GT(middle().red(), 240);
+    EXPECT_EQ(field(EditRecord::RedMarker), QStringLiteral("000"));
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(copy));
+}
+
+TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\p\\bad.jpg"), "no picture"));
+    open(lying);
+    tFrmNew& editor = open(QStringLiteral("C:\\p\\bad.jpg"));
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_FALSE(editor.pictureOpen());
+    EXPECT_TRUE(editor.PicPic.isNull());
+    for (int index = 0; index < 11; ++index) {
+        editor.Image2_Click(index);
+        editor.Image2_MouseDown(index);
+        editor.tickOnceIfNone();
+        editor.Image2_MouseUp(index);
+    }
+    const std::array<void (tFrmNew::*)(), 17> presses = {
+        &tFrmNew::Image15_Click,  &tFrmNew::Image18_Click,   &tFrmNew::Image27_Click,   &tFrmNew::Image4_Click,
+        &tFrmNew::Image5_Click,   &tFrmNew::Image20_Click,   &tFrmNew::Image22_Click,   &tFrmNew::Image28_Click,
+        &tFrmNew::Command4_Click, &tFrmNew::Command5_Click,  &tFrmNew::Command6_Click,  &tFrmNew::Command8_Click,
+        &tFrmNew::Command9_Click, &tFrmNew::Command11_Click, &tFrmNew::Command14_Click, &tFrmNew::Image135_MouseDown,
+        &tFrmNew::tickOnceIfNone};
+    for (const auto press : presses)
+        (editor.*press)();
+    editor.Misgerett_Click(true);
+    editor.VScrollZ_Change(50);
+    EXPECT_EQ(state.edit.EditState, EditRecord::newPicture());
+    EXPECT_TRUE(stored.isEmpty());
+    EXPECT_TRUE(editor.takeSmallView().isNull());
+}
+
+TEST_F(TheEditor, readsBadRecordsAsThePictureWithoutThatEdit) {
+    makeFrame(QStringLiteral("simple"), QStringLiteral("003"), Qt::green);
+    struct Case {
+        EditRecord::Column column;
+        const char* value;
+    };
+    for (const Case& c :
+         {Case{EditRecord::ZoomPercent, "xx"}, Case{EditRecord::ZoomPercent, "999"}, Case{EditRecord::PanX, "ab"},
+          Case{EditRecord::RotationCode, "?"}, Case{EditRecord::FrameFolder, ".."},
+          Case{EditRecord::FrameFolder, "\\p"}, Case{EditRecord::ToneFlag, "x"}, Case{EditRecord::GainG, "eee"}}) {
+        tFrmNew& editor = open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, QStringLiteral("003")));
+        EXPECT_TRUE(editor.pictureOpen()) << c.value;
+        EXPECT_LT(corner().green(), 100) << c.value;
+    }
+    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
+}
+
+TEST_F(TheEditor, takesThePaperFromTheOrderAndPassesOverWhatIsNoSize) {
+    struct Case {
+        const char* paper;
+        PictureSize box;
+    };
+    for (const Case& c :
+         {Case{"10/15", {450, 300}}, Case{"13/18", {450, 325}}, Case{"09/13", {450, 311}}, Case{"30/40", {450, 337}},
+          Case{"zz/zz", {450, 300}}, Case{"***", {450, 300}}, Case{"", {450, 300}}}) {
+        chain.unload(PageId::tFrmNew);
+        state.shemot.ppr = QString::fromLatin1(c.paper);
+        EXPECT_EQ(open(lying).PicPicSize, c.box) << c.paper;
+    }
+}
+
+TEST_F(TheEditor, putsTheBordersFrameOnAPictureThatHasNone) {
+    makeFrame(QStringLiteral("borders"), QStringLiteral("001"), Qt::green);
+    state.shemot.Bord = QStringLiteral("WBX");
+    tFrmNew& editor = open(lying);
+    EXPECT_EQ(editor.Combo2.text, QStringLiteral("001"));
+    EXPECT_EQ(field(EditRecord::FrameName), QStringLiteral("001"));
+    EXPECT_EQ(field(EditRecord::FrameFolder).trimmed(), QStringLiteral("borders"));
+    EXPECT_GT(corner().green(), 240);
+    editor.Misgerett_Click(false);
+    EXPECT_GT(corner().red(), 240);
+    editor.Misgerett_Click(true);
+    EXPECT_GT(corner().green(), 240);
+    editor.Image28_Click();
+    EXPECT_GT(corner().red(), 240);
+    EXPECT_EQ(stored.last().mid(32, 6), QStringLiteral("999W00"));
+}
+
+TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
+    makeFrame(QStringLiteral("aa"), QStringLiteral("001"), Qt::green);
+    makeFrame(QStringLiteral("aa"), QStringLiteral("002"), Qt::blue);
+    makeFrame(QStringLiteral("bb"), QStringLiteral("007"), Qt::yellow);
+    makeFrame(QStringLiteral("much too long"), QStringLiteral("001"), Qt::green);
+    makeFrame(QStringLiteral("aa"), QStringLiteral("long"), Qt::green);
+    makeFrame(QStringLiteral("aa"), QStringLiteral("K9"), Qt::green);
+    tFrmNew& editor = open(lying);
+    EXPECT_EQ(editor.Combo4List.items(), QStringList({QStringLiteral("aa"), QStringLiteral("bb")}));
+    EXPECT_EQ(editor.Combo2List.items(), QStringList({QStringLiteral("001"), QStringLiteral("002")}));
+    EXPECT_EQ(editor.Label5.text, QStringLiteral("2"));
+    EXPECT_FALSE(editor.framePicture(1).isNull());
+
+    editor.Image20_Click();
+    EXPECT_EQ(stored.last().mid(32, 3), QStringLiteral("001"));
+    editor.Image20_Click();
+    editor.Image20_Click();
+    EXPECT_EQ(editor.Label6.text, QStringLiteral("2  / "));
+    EXPECT_EQ(stored.last().mid(32, 3), QStringLiteral("002"));
+    EXPECT_GT(corner().blue(), 240);
+    editor.Image21_Click();
+    editor.Image21_Click();
+    EXPECT_EQ(stored.last().mid(32, 3), QStringLiteral("001"));
+
+    // Another category is looked at; the picture's frame stays until one is taken.
+    const QString before = state.edit.EditState;
+    editor.Combo4_Click(1);
+    editor.Command5_Click();
+    EXPECT_EQ(state.edit.EditState, before);
+    editor.Misgerett_Click(false);
+    editor.Image22_Click();
+    EXPECT_TRUE(editor.Misgerett.checked);
+    EXPECT_EQ(stored.last().mid(32, 3), QStringLiteral("007"));
+    EXPECT_EQ(stored.last().mid(44, 10), QStringLiteral("bb        "));
+    EXPECT_GT(corner().green(), 240);
+}
+
+TEST_F(TheEditor, recordsLineFramesAndPaintsThemNowhere) {
+    tFrmNew& editor = open(lying);
+    const QImage before = editor.PicPic.image();
+    for (int i = 0; i < 3; ++i)
+        editor.Command9_Click();
+    EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("W05"));
+    editor.pic4Msgrt_MouseMove({40, 70});
+    editor.pic4Msgrt_MouseMove({40, 130}); // below the cells
+    EXPECT_EQ(editor.Label4.text, QStringLiteral("6"));
+    EXPECT_EQ(editor.palette.marker(), QRect(33, 66, 33, 33));
+    editor.PicInMsgrt_Click();
+    for (int i = 0; i < 30; ++i)
+        editor.Command9_Click();
+    EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("Y29"));
+    editor.Command18_Click();
+    EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("Y28"));
+    EXPECT_EQ(editor.PicPic.image(), before);
+}
+
+TEST_F(TheEditor, placesTheCaptionsBoxAndFindsTheAnchorBack) {
+    EditFields fields;
+    fields.TextX = 200;
+    fields.TextY = 150;
+    fields.TextFontSize = 24;
+    fields.TextBody = QStringLiteral("twelve signs");
+    const double width = TextLabelPlace::boxOf(fields).width;
+    EXPECT_NEAR(width, 12 * 12, 24);
+    EXPECT_EQ(TextLabelPlace::blanks(fields).size(), 24);
+    const double tall = 3 + 25 * 12;
+    struct Case {
+        std::int16_t vertical, align;
+        double left, top;
+        QPoint back;
+    };
+    for (const Case& c : {Case{0, 0, 200, 150, {200, 150}}, Case{0, 1, 200 - width / 2, 150, {200, 150}},
+                          Case{0, 2, 200 - width, 150, {203, 150}}, Case{3, 0, 165, 150, {203, 150}},
+                          Case{3, 1, 165, 150 - tall / 2, {200, 150}}, Case{3, 2, 165, 150 - tall, {200, 150}}}) {
+        fields.TextVertical = c.vertical;
+        fields.TextAlign = c.align;
+        const TextLabelBox box = TextLabelPlace::boxOf(fields);
+        EXPECT_NEAR(box.left, c.left, 1e-9);
+        EXPECT_NEAR(box.top, c.top, 1e-9);
+        EXPECT_EQ(TextLabelPlace::anchorOf(box, fields), c.back) << c.vertical << ' ' << c.align;
+    }
+}
+
+TEST_F(TheEditor, beginsACaptionAndHandsItToTheKeyboard) {
+    tFrmNew& editor = open(lying);
+    editor.Command8_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::mikledet);
+    EXPECT_TRUE(editor.Labeltext.visible);
+    EXPECT_EQ(state.edit.TextFontSize, 24);
+    EXPECT_TRUE(static_cast<mikledet&>(*chain.front()).Check4.checked);
+    state.edit.TextBody = QStringLiteral("Dana");
+    editor.Command11_Click();
+    EXPECT_EQ(stored.last().mid(54, 8), QStringLiteral("240 0 0 "));
+    EXPECT_EQ(stored.last().mid(74, 15), QStringLiteral("30 255255100100"));
+    EXPECT_EQ(stored.last().mid(126, 4), QStringLiteral("Dana"));
+    editor.CommandDone_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+    EXPECT_EQ(chain.find(PageId::mikledet), nullptr);
+}
+
+TEST_F(TheEditor, showsCropMarkersThatStayAParallelogramAndCutNothing) {
+    using Corner = CropFrame::Corner;
+    tFrmNew& editor = open(lying);
+    const QImage before = editor.PicPic.image();
+    editor.Command14_Click();
+    EXPECT_EQ(editor.crop.marker(Corner::Picture14), QPoint(450, 300));
+    editor.CropHandle_MouseDown(Corner::Picture10, {450, 0});
+    editor.CropHandle_MouseMove({450 - 130, 26});
+    editor.CropHandle_MouseUp();
+    EXPECT_EQ(editor.crop.marker(Corner::Picture10), QPoint(440, 2));
+    EXPECT_EQ(editor.crop.marker(Corner::Picture14), QPoint(440, 302));
+    editor.Command13_Click();
+    const QPoint inset = editor.crop.marker(Corner::Picture11);
+    editor.Command16_Click();
+    EXPECT_LT(editor.crop.marker(Corner::Picture11).x(), inset.x());
+    for (int i = 0; i < 100; ++i)
+        editor.Command15_Click();
+    EXPECT_LT(editor.crop.marker(Corner::Picture11).y(), editor.crop.marker(Corner::Picture14).y());
+    EXPECT_EQ(editor.PicPic.image(), before);
+    EXPECT_TRUE(stored.isEmpty());
+}
+
+TEST_F(TheEditor, tellsOnceThatTheWorkPictureCannotBeWritten) {
+    ASSERT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora\\0.bmp")));
+    open(lying);
+    open(standing);
+    EXPECT_TRUE(page().pictureOpen());
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+}
+
+TEST_F(TheEditor, keepsTheSmallViewInLogicalPixelsHoweverSharpTheScreen) {
+    page().setPreviewScale(2);
+    tFrmNew& editor = open(lying);
+    EXPECT_EQ(editor.PicPic.width(), 900);
+    editor.Image15_Click();
+    Result<EditedPreview> expected = EditedPreview::open(host(lying), {10, 15}, 100, EditedPreview::Tone::Colour);
+    ASSERT_TRUE(expected);
+    EXPECT_EQ(editor.takeSmallView().image(), expected->render(state.edit, std::nullopt).image());
+    EXPECT_TRUE(editor.takeSmallView().isNull());
+    editor.setPreviewScale(1);
+    EXPECT_EQ(editor.PicPic.width(), 450);
+}
+
+TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
+    open(lying);
+    page().Command6_Click();
+    EXPECT_EQ(stored.last().mid(41, 3), QStringLiteral("111"));
+    auto& surfaces = static_cast<BigPics&>(chain.load(PageId::BigPics));
+    EXPECT_FALSE(surfaces.List1.isEmpty());
+    surfaces.List1.clear();
+    open(lying, state.edit.EditState);
+    EXPECT_FALSE(surfaces.List1.isEmpty());
+}
+
+TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {
+    tFrmNew& editor = open(lying);
+    QStringList picked;
+    QObject::connect(&editor, &tFrmNew::picked, [&](const QString& path) { picked += path; });
+    editor.Image2_Click(6);
+    const QString before = state.edit.EditState;
+    editor.Command2_Click();
+    EXPECT_EQ(chain.front(), &editor);
+    EXPECT_EQ(state.edit.GainR, 1.06F);
+    machine.dialogs.picks += standing;
+    editor.Command2_Click();
+    EXPECT_EQ(picked, QStringList({standing}));
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+    EXPECT_EQ(state.edit.EditState, before);
+    EXPECT_EQ(machine.dialogs.pickRequests.size(), 2);
+    EXPECT_TRUE(machine.dialogs.pickRequests[0].endsWith(QStringLiteral("בחר תמונה אחת וכל התמונות תוצגנה")));
+}
+
+TEST_F(TheEditor, speaksTheLanguageOfTheSession) {
+    tFrmNew& editor = page();
+    EXPECT_EQ(editor.Command8.text, QStringLiteral("Text כיתוב"));
+    EXPECT_EQ(editor.Combo5.text, QStringLiteral("מיסגרות"));
+    EXPECT_EQ(editor.Image2[0].hint, QStringLiteral("זום התקרב= לחיצה ממושכת על העכבר = "));
+    EXPECT_EQ(editor.Image17.hint, QStringLiteral("סובב לשמאל = לחיצה ממושכת על העכבר = "));
+    EXPECT_TRUE(editor.Image15.hint.isEmpty());
+    state.EnglishTips = 1;
+    editor.setTexts();
+    EXPECT_EQ(editor.Command8.text, QStringLiteral("Add text"));
+    EXPECT_EQ(editor.Combo5.text, QStringLiteral("Frames"));
+}
+
+} // namespace
+} // namespace lumora
