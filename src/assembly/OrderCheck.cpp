@@ -127,8 +127,23 @@ private:
                       .arg(m_log.failed.size()));
     }
 
+    // An edited order may have its sheet under a plain ending, instead or beside.
     void checkSheet() {
-        const QString name = u'!' + m_log.tail.orderNumber + u'_' + m_log.tail.serial + QStringLiteral(".jpp");
+        const QString stem = u'!' + m_log.tail.orderNumber + u'_' + m_log.tail.serial;
+        const QString plain = stem + QStringLiteral(".jpg");
+        const bool hasPlain = m_log.edited && has(plain);
+        if (hasPlain)
+            checkSheet(plain);
+        if (!hasPlain || has(stem + QStringLiteral(".jpp")))
+            checkSheet(stem + QStringLiteral(".jpp"));
+    }
+
+    bool has(const QString& name) const {
+        std::error_code error;
+        return fs::exists(m_folder / toHostPath(name), error);
+    }
+
+    void checkSheet(const QString& name) {
         const Result<QByteArray> sheet = readHostFile(m_folder / toHostPath(name));
         const Result<void> whole = sheet ? checkWholeJpeg(*sheet) : Result<void>(sheet.failure());
         if (!whole)

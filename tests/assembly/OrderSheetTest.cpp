@@ -53,6 +53,22 @@ TEST(OrderSheet, tellsTheOrderInSixLines) {
     EXPECT_TRUE(linesOf(state)[0].contains(QStringLiteral("קבלת תמונות")));
 }
 
+TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
+    SessionState state = sessionOfTheExample();
+    state.KodMishloach = QStringLiteral("HOM");
+    const QStringList wanted = {
+        QStringLiteral("No.....105_1234    21/11/2026 14:05:09     קבלת תמונות בדואר  ver: 4.00"),
+        QStringLiteral("  Name....Dana Levi        Tel.....03-1234567      "),
+        QStringLiteral("    Herzl 1      "),
+        QStringLiteral("  Paper size....10/15       paper Kind  Matte"),
+        QStringLiteral("  Total pictures...13   Border=  NB     Mail  dana@example.com"),
+        QStringLiteral("  gift - "),
+    };
+    EXPECT_EQ(editedSheetLines(state, FixedClock().now()), wanted);
+    state.shemot.ppr = QStringLiteral("zz/zz");
+    EXPECT_EQ(orderSheetBackground(SheetKind::Edited, state), QColor(Qt::white));
+}
+
 TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
     SessionState state = sessionOfTheExample();
     state.album.ShemErooa = QStringLiteral("Wedding");

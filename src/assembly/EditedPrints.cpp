@@ -1,0 +1,77 @@
+#include "assembly/EditedPrints.h"
+
+#include "common/FixedText.h"
+#include "editing/EditRecord.h"
+#include "editing/EditedPicture.h"
+#include "imaging/BmpFile.h"
+#include "imaging/ColourMatrix.h"
+#include "platform/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <new>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::path& toneCopy) try {
+    if (edit.ToneFlag != 1)
+        return {renderEditedPrintToJpeg(print, edit)};
+    const Result<Bitmap> picture = loadPicture(print.file);
+    if (!picture)
+        return {picture.failure()};
+    auto copy = std::make_unique<NewContent>(toneCopy, toText(toneCopy));
+    appendBmp(ColourMatrix::grey(greyWeight).applied(onWhite(*picture)), *copy, [] { return false; });
+    if (copy->failed())
+        return {Failure{Failure::Kind::Other, toText(toneCopy)}, std::move(copy)};
+    print.file = copy->temporary();
+    print.source = EditedPrint::Source::AlreadyGrey;
+    return {renderEditedPrintToJpeg(print, edit), std::move(copy)};
+} catch (const std::bad_alloc&) {
+    return {Failure{Failure::Kind::TooLarge, QStringLiteral("%1: memory is short").arg(toText(print.file))}};
+}
+
+} // namespace
+
+EditedPrints::EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
+                           std::optional<PaperDigits> paper)
+    : m_state(state)
+    , m_files(files)
+    , m_paper(paper) {
+    for (const QString& text : items) {
+        OrderItem item = OrderItem::split(text, OrderItem::Form::Edited);
+        if (item.hasUsableName())
+            m_items.push_back(std::move(item));
+    }
+    m_ahead = std::make_unique<Ahead>(static_cast<int>(m_items.size()),
+                                      [this](int i) { return rendering(m_items[static_cast<std::size_t>(i)]); });
+}
+
+EditedPrints::Ahead::Work EditedPrints::rendering(const OrderItem& item) const {
+    EditFields edit;
+    UnpackEditState(item.record, edit);
+    const Drives& drives = m_files.drives();
+    const QString source =
+        edit.RedMarker == QStringLiteral("RED") ? EditedPaths::corrected(m_state, item.path) : item.path;
+    const std::optional<HostPath> file = HasQuestionMark(source) ? std::nullopt : drives.toHost(source);
+    const std::optional<HostPath> copy = drives.toHost(EditedPaths::toneCopy(m_state));
+    if (!m_paper || !file || !copy)
+        return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source}}; };
+    EditedPrint print;
+    print.file = *file;
+    print.paper = *m_paper;
+    print.framesFolder = drives.toHost(WorkspacePaths::misgarot(m_state)).value_or(HostPath());
+    return [print, edit, copy = *copy] { return render(print, edit, copy); };
+}
+
+QString EditedPaths::toneCopy(const SessionState& state) {
+    return WorkspacePaths::root(state) + QStringLiteral("\\bw.bmp");
+}
+
+QString EditedPaths::corrected(const SessionState& state, const QString& path) {
+    return WorkspacePaths::tempred(state) + u'\\' + MangleFileName(path);
+}
+
+} // namespace lumora
