@@ -25,8 +25,7 @@ namespace {
 constexpr int holdPace = 100;
 constexpr int noticeTime = 4000;
 constexpr int arrowStep = 2;
-constexpr double dragShare = 13; // a drag moves the picture by this part of its way at each event
-constexpr double tremble = 8;    // units of the viewing area that a finger moves without meaning to drag
+constexpr double tremble = 8; // units of the viewing area that a finger moves without meaning to drag
 constexpr int overviewDensity = 2;
 const QStringList wheelSteps = {u"2"_s, u"0"_s, u"-2"_s};
 
@@ -150,12 +149,12 @@ void RedI::Picture1_MouseDown(Button button, QPointF at) {
     if (!ready())
         return;
     if (button == Button::Right) {
-        m_dragActive = false;
+        m_drag.release();
         kofez_Open();
         return;
     }
-    m_dragAnchor = at;
-    m_dragActive = true;
+    m_drag.press(at);
+    m_pressed = at;
     m_dragged = false;
 }
 
@@ -167,21 +166,21 @@ void RedI::Picture1_MouseMove(QPointF at) {
         Picture7_MouseMove(at - patchPlace.topLeft());
     else if (Picture1.image().valid(pixel))
         showPixel(Picture1.image().pixel(pixel), pixel);
-    if (!m_dragActive)
+    if (!m_drag.held())
         return;
-    const QPointF way = (m_dragAnchor - at) * Magnification;
-    m_dragged = m_dragged || way.manhattanLength() > tremble;
+    m_dragged = m_dragged || ((at - m_pressed) * Magnification).manhattanLength() > tremble;
     if (!m_dragged)
         return;
     // Points are those of the picture, which moves under the pointer: it follows softly.
-    moveTo(Picture1Left - way.x() / dragShare, Picture1Top - way.y() / dragShare);
+    const QPointF way = m_drag.distance(at) * Magnification;
+    moveTo(Picture1Left + way.x(), Picture1Top + way.y());
     Q_EMIT changed();
 }
 
 void RedI::Picture1_MouseUp(QPointF at) {
-    if (!m_dragActive)
+    if (!m_drag.held())
         return;
-    m_dragActive = false;
+    m_drag.release();
     const QPoint pixel(static_cast<int>(std::floor(at.x())), static_cast<int>(std::floor(at.y())));
     if (m_dragged || !ready() || !Picture1.image().valid(pixel))
         return;
@@ -191,7 +190,7 @@ void RedI::Picture1_MouseUp(QPointF at) {
 }
 
 void RedI::Picture1_MouseLost() {
-    m_dragActive = false;
+    m_drag.release();
     stopHolds();
 }
 
@@ -220,18 +219,22 @@ void RedI::Arrow_MouseUp() {
 }
 
 void RedI::Timer2_Tick() {
+    m_ticked = true;
     moveCircle(0, -arrowStep);
 }
 
 void RedI::Timer3_Tick() {
+    m_ticked = true;
     moveCircle(0, arrowStep);
 }
 
 void RedI::Timer4_Tick() {
+    m_ticked = true;
     moveCircle(-arrowStep, 0);
 }
 
 void RedI::Timer5_Tick() {
+    m_ticked = true;
     moveCircle(arrowStep, 0);
 }
 
@@ -307,6 +310,7 @@ void RedI::Size_MouseUp() {
 }
 
 void RedI::Timer1_Tick() {
+    m_ticked = true;
     resizeCircle(m_sizeStep);
 }
 
@@ -332,8 +336,24 @@ void RedI::resizeCircle(int by) {
 
 void RedI::startHold(Ticker& timer) {
     stopHolds();
+    m_ticked = false;
     if (canCorrect())
         timer.start();
+}
+
+void RedI::tickOnceIfNone() {
+    if (m_ticked)
+        return;
+    if (Timer1.running())
+        Timer1_Tick();
+    else if (Timer2.running())
+        Timer2_Tick();
+    else if (Timer3.running())
+        Timer3_Tick();
+    else if (Timer4.running())
+        Timer4_Tick();
+    else if (Timer5.running())
+        Timer5_Tick();
 }
 
 void RedI::stopHolds() {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "editing/DragHandle.h"
 #include "editing/RedEye.h"
 #include "editing/RedUndoCopy.h"
 #include "imaging/Bitmap.h"
@@ -51,7 +52,7 @@ public:
     void Picture1_MouseDown(Button button, QPointF at); // points of the picture
     void Picture1_MouseMove(QPointF at);
     void Picture1_MouseUp(QPointF at); // one that hardly moved picks the point
-    void Picture1_MouseLost();         // the pointer was taken away
+    void Picture1_MouseLost();         // the pointer was taken away: no pick
     void Image12_MouseDown();          // the arrows: up, down, left, right
     void Image13_MouseDown();
     void Image14_MouseDown();
@@ -69,6 +70,10 @@ public:
     void Image11_MouseDown(); // larger
     void Size_MouseUp();
     void Timer1_Tick();
+    // A press of a held button that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
+    void tickOnceIfNone();
+    // The pointer was lost or the page went: nothing is held any more.
+    void stopHolds();
     void Combo1_Change(int index); // a turn of the wheel
 
     // Events: corrections
@@ -173,7 +178,6 @@ private:
     void resizeCircle(int by);
     void magnify(int to);
     void startHold(Ticker& timer);
-    void stopHolds();
 
     bool keepUndoCopy(const QRect& part);
     void takePatch();
@@ -206,9 +210,10 @@ private:
     int m_circleSize = 40;
     int m_sizeStep = 0;
     RedEye::Peak m_peak;
-    bool m_dragActive = false;
+    DragHandle m_drag;
+    QPointF m_pressed; // where the drag began
     bool m_dragged = false;
-    QPointF m_dragAnchor;
+    bool m_ticked = false;  // since a button was held down
     bool m_focused = false; // Memokad; nothing reads it
     Step m_step = Step::FindEye;
 };

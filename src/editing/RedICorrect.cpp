@@ -65,7 +65,7 @@ void RedI::correct() {
     Frame6.visible = false;
     Command13_Click();
     takePatch();
-    m_dragActive = false;
+    m_drag.release();
     List1.append(RedEye::correct(Picture1, patchPlace, m_peak.ratio(), RedFixLevel));
     Image1.visible = false;
     Picture7 = Bitmap(Picture1.image().copy(patchPlace));

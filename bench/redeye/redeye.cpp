@@ -1,0 +1,123 @@
+// A correction of a red eye on a picture of 50 megapixels with a circle of 60 pixels: the processor time of the press,
+// beside the same rule on a copy of the whole picture with an overview scaled anew, which is how it is done where
+// pictures are values.
+
+#include "common/HostFile.h"
+#include "editing/RedI.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/SamplePhotographs.h"
+#include "support/TestPlatform.h"
+
+#include <QGuiApplication>
+#include <QPainter>
+
+#include <algorithm>
+#include <chrono>
+#include <cstdio>
+#include <ctime>
+#include <filesystem>
+#include <thread>
+#include <vector>
+
+using namespace lumora;
+
+namespace {
+
+constexpr PictureSize fiftyMegapixels{8660, 5773};
+constexpr int circle = 60;
+
+// Of all threads, in milliseconds.
+double processorTime() {
+    return 1000.0 * static_cast<double>(std::clock()) / CLOCKS_PER_SEC;
+}
+
+double wallTime() {
+    return std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now().time_since_epoch()).count();
+}
+
+QPoint eye(int round) {
+    return {500 + round * 137 % (fiftyMegapixels.width - 1000), 400 + round * 211 % (fiftyMegapixels.height - 800)};
+}
+
+void print(const char* what, std::vector<double> times) {
+    std::sort(times.begin(), times.end());
+    std::printf("%-58s median %8.2f ms   lowest %8.2f   highest %8.2f\n", what, times[times.size() / 2], times.front(),
+                times.back());
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    QGuiApplication application(argc, argv);
+    const int rounds = argc > 1 ? std::max(1, std::atoi(argv[1])) : 21;
+
+    TestPlatform machine;
+    SessionState state;
+    state.DiskRoot = machine.drives.programRoot();
+    PageChain chain(machine.pump);
+    chain.registerPage(PageId::RedI, [&] { return std::make_unique<RedI>(state, machine.platform, chain); });
+    {
+        Bitmap photograph = samplePhotograph(fiftyMegapixels, 1);
+        QPainter painter(&photograph.image());
+        for (int round = 0; round < rounds; ++round) {
+            painter.setBrush(QColor(200, 30, 40));
+            painter.drawEllipse(eye(round), circle / 2 - 4, circle / 2 - 4);
+        }
+        painter.end();
+        const auto file = encodeJpeg(photograph, 92);
+        if (!file || !writeWholeFile(machine.drives.dataFolder() / "large.jpg", *file))
+            return 1;
+    }
+
+    auto& page = static_cast<RedI&>(chain.load(PageId::RedI));
+    double processor = processorTime();
+    double wall = wallTime();
+    page.open(QStringLiteral("C:\\large.jpg"));
+    if (page.Picture1.isNull())
+        return 1;
+    std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", wallTime() - wall, processorTime() - processor);
+    processor = processorTime();
+    std::this_thread::sleep_for(std::chrono::seconds(5)); // the customer looks for the eye
+    std::printf("the undo copy in the background: processor %.0f ms\n", processorTime() - processor);
+
+    std::vector<double> ours;
+    std::vector<double> oursWall;
+    std::vector<double> undo;
+    std::vector<double> copied;
+    for (int round = 0; round < rounds; ++round) {
+        const QPoint at = eye(round);
+        page.Picture1_MouseDown(RedI::Button::Left, at);
+        page.Picture1_MouseUp(at);
+        while (page.circle().width() != circle)
+            page.Combo1_Change(page.circle().width() < circle ? 0 : 2);
+        processor = processorTime();
+        wall = wallTime();
+        page.Image2_Click();
+        ours.push_back(processorTime() - processor);
+        oursWall.push_back(wallTime() - wall);
+        if (page.List1.isEmpty()) {
+            std::fprintf(stderr, "nothing was corrected\n");
+            return 1;
+        }
+        processor = processorTime();
+        page.Image7_Click();
+        undo.push_back(processorTime() - processor);
+
+        processor = processorTime();
+        Bitmap copy(page.Picture1.image().copy());
+        const RedEye::Peak peak = RedEye::findPeak(copy, at);
+        const auto changed = RedEye::correct(copy, page.circle(), peak.ratio(), 0);
+        const QImage overview =
+            copy.image().scaled(page.Picture3.image().size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+        copied.push_back(processorTime() - processor);
+        if (changed.isEmpty() || overview.isNull())
+            return 1;
+    }
+    print("a correction, processor time", ours);
+    print("the same, elapsed", oursWall);
+    print("one step back, processor time", undo);
+    print("the rule on a whole copy, overview scaled by Qt", copied);
+    return 0;
+}

@@ -1,0 +1,458 @@
+#include "editing/RedI.h"
+
+#include "editing/RedOverview.h"
+#include "editing/tFrmNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <QPainter>
+
+#include <fstream>
+#include <functional>
+#include <map>
+#include <memory>
+
+namespace lumora {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr QRgb skin = qRgb(180, 140, 120);
+constexpr QRgb pupil = qRgb(210, 42, 58);
+const QString undoCopy = u"C:\\2000lumora\\zmany\\tempred\\000.bmp"_s;
+const QString correctedCopy = u"C:\\2000lumora\\zmany\\tempred\\C;]pics]eyes.jpg"_s;
+
+// Two pupils of 9 pixels, and one at the very corner.
+constexpr QPoint leftEye{60, 50};
+constexpr QPoint rightEye{140, 50};
+
+class RedEyePage : public ::testing::Test {
+protected:
+    RedEyePage()
+        : chain(machine.pump) {
+        state.DiskRoot = machine.drives.programRoot();
+        chain.registerPage(PageId::tFrmNew,
+                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::RedI, [this] { return std::make_unique<RedI>(state, machine.platform, chain); });
+        std::filesystem::create_directories(machine.drives.dataFolder() / "pics");
+        Bitmap face(200, 150, QColor::fromRgb(skin));
+        QPainter painter(&face.image());
+        for (const QPoint eye : {leftEye, rightEye, QPoint(1, 1)})
+            painter.fillRect(QRect(eye.x() - 4, eye.y() - 4, 9, 9), QColor::fromRgb(pupil));
+        painter.end();
+        save(face);
+        state.edit.RedMarker = u"000"_s;
+    }
+
+    // Without loss, whatever the name's ending says.
+    void save(const Bitmap& picture) {
+        state.edit.PicturePath = u"C:\\pics\\eyes.jpg"_s;
+        ASSERT_TRUE(picture.image().save(host(state.edit.PicturePath), "PNG"));
+        original = picture.image();
+        customersFile = *machine.files.read(state.edit.PicturePath);
+    }
+    QString host(const QString& path) const { return toText(*machine.drives.toHost(path)); }
+
+    RedI& open() {
+        auto& page = static_cast<RedI&>(chain.load(PageId::RedI));
+        page.open(state.edit.PicturePath);
+        return page;
+    }
+    bool isOpen() const { return chain.find(PageId::RedI) != nullptr; }
+
+    static void pick(RedI& page, QPoint at) {
+        page.Picture1_MouseDown(RedI::Button::Left, at);
+        page.Picture1_MouseUp(at);
+    }
+    static void setSize(RedI& page, int size) {
+        while (page.circle().width() != size) {
+            page.circle().width() < size ? page.Image11_MouseDown() : page.Image10_MouseDown();
+            page.Timer1_Tick();
+            page.Size_MouseUp();
+        }
+    }
+    static void correctAt(RedI& page, QPoint at) {
+        pick(page, at);
+        page.Image2_Click();
+    }
+    static bool isGrey(QRgb pixel) { return qRed(pixel) == qGreen(pixel) && qGreen(pixel) == qBlue(pixel); }
+    QImage pictureIn(const QString& path) const {
+        const Result<Bitmap> picture = loadPicture(*machine.drives.toHost(path));
+        return picture ? picture->image().convertToFormat(QImage::Format_RGB32) : QImage();
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+    QImage original;
+    QByteArray customersFile;
+};
+
+TEST_F(RedEyePage, GreysByLevelAsTheMenuSays) {
+    using Grey = std::map<std::pair<int, int>, int>;
+    const std::map<std::pair<int, int>, QRgb> marks = {{{4, 4}, pupil},
+                                                       {{2, 6}, pupil},
+                                                       {{0, 0}, qRgb(120, 44, 36)},
+                                                       {{5, 4}, qRgb(110, 60, 60)},
+                                                       {{3, 4}, qRgb(110, 62, 58)},
+                                                       {{4, 5}, qRgb(110, 70, 58)},
+                                                       {{4, 3}, qRgb(120, 76, 66)},
+                                                       {{3, 3}, qRgb(60, 50, 50)},
+                                                       {{5, 5}, qRgb(250, 250, 250)}};
+    Bitmap eye(9, 9, QColor::fromRgb(skin));
+    for (const auto& [at, colour] : marks)
+        eye.image().setPixel(at.first, at.second, colour);
+    save(eye);
+    const Grey basic = {{{4, 4}, 80}, {{2, 6}, 80}, {{0, 0}, 60}, {{5, 4}, 71}};
+    Grey further = basic;
+    further.insert({{{3, 4}, 72}, {{4, 5}, 78}});
+    Grey deepest = further;
+    deepest.insert({{{4, 3}, 85}, {{3, 3}, 52}});
+
+    RedI& page = open();
+    pick(page, {4, 4});
+    setSize(page, 9);
+    ASSERT_EQ(page.circle(), QRect(0, 0, 9, 9));
+    struct Case {
+        const char* name;
+        std::function<void()> press;
+        Grey grey;
+    };
+    const Case cases[] = {{"Image2", [&] { page.Image2_Click(); }, basic},
+                          {"Bsisi", [&] { page.Bsisi_Click(); }, basic},
+                          {"amok2", [&] { page.amok2_Click(); }, further},
+                          {"amok5", [&] { page.amok5_Click(); }, deepest}};
+    for (const Case& wanted : cases) {
+        page.kofez_Open();
+        wanted.press();
+        EXPECT_EQ(page.Label25.text + u' ' + page.Label30.text + u' ' + page.Label31.text, u"320 240 4"_s);
+        EXPECT_EQ(page.RedFixLevel, 0);
+        if (wanted.grey == basic) {
+            EXPECT_EQ(page.List1.items().join(u' '), u"0^0 2^6 4^4 5^4"_s);
+        }
+        for (int y = 0; y < 9; ++y) {
+            for (int x = 0; x < 9; ++x) {
+                const auto grey = wanted.grey.find({x, y});
+                const QRgb expected =
+                    grey == wanted.grey.end() ? original.pixel(x, y) : qRgb(grey->second, grey->second, grey->second);
+                EXPECT_EQ(page.Picture1.image().pixel(x, y), expected) << wanted.name << ' ' << x << ',' << y;
+            }
+        }
+        page.kofez_Close();
+        page.Image5_Click();
+        EXPECT_EQ(page.Picture1.image(), original) << wanted.name;
+    }
+}
+
+TEST_F(RedEyePage, EachFurtherPressGoesTenDeeperUntilAnotherEyeIsPicked) {
+    RedI& page = open();
+    pick(page, leftEye);
+    page.Image16_Click();
+    page.Image16_Click();
+    EXPECT_EQ(page.RedFixLevel, 20);
+    EXPECT_EQ(page.Label37.text, u"20"_s);
+    EXPECT_EQ(page.Label43.text, QString::number(page.List2.count()));
+    page.amok_Click();
+    EXPECT_EQ(page.RedFixLevel, 30);
+    pick(page, rightEye);
+    EXPECT_EQ(page.RedFixLevel, 0);
+    page.HScroll1_Change(3);
+    EXPECT_EQ(page.RedFixLevel, 30);
+}
+
+TEST_F(RedEyePage, WritesNothingWithoutACorrection) {
+    pick(open(), leftEye);
+    static_cast<RedI&>(*chain.find(PageId::RedI)).Image8_Click();
+    EXPECT_FALSE(isOpen());
+    EXPECT_EQ(state.edit.RedMarker, u"000"_s);
+    EXPECT_TRUE(machine.files.names(u"C:\\2000lumora\\zmany\\tempred"_s, u"*"_s).isEmpty());
+
+    correctAt(open(), leftEye);
+    static_cast<RedI&>(*chain.find(PageId::RedI)).Image9_Click();
+    EXPECT_FALSE(isOpen());
+    EXPECT_EQ(state.edit.RedMarker, u"000"_s);
+    EXPECT_FALSE(machine.files.fileExists(correctedCopy));
+}
+
+TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwnAndTheNextVisitStartsFromTheCustomersFile) {
+    chain.load(PageId::tFrmNew);
+    RedI& page = open();
+    correctAt(page, leftEye);
+    correctAt(page, rightEye);
+    const QImage corrected = page.Picture1.image();
+    page.Image8_Click();
+    EXPECT_FALSE(isOpen());
+    EXPECT_EQ(state.edit.RedMarker, u"RED"_s);
+    EXPECT_EQ(state.edit.EditState.mid(38, 3), u"RED"_s);
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\job_folder\\red_folder"_s));
+    EXPECT_EQ(machine.files.read(correctedCopy)->left(2), "BM");
+    EXPECT_EQ(pictureIn(correctedCopy), corrected);
+    EXPECT_EQ(*machine.files.read(state.edit.PicturePath), customersFile);
+
+    RedI& again = open();
+    EXPECT_EQ(again.Picture1.image(), original);
+    EXPECT_FALSE(again.RedChanged);
+    correctAt(again, leftEye);
+    const QImage replaced = again.Picture1.image();
+    again.Image8_Click();
+    EXPECT_EQ(pictureIn(correctedCopy), replaced);
+}
+
+TEST_F(RedEyePage, MarksThePictureOnlyWhenTheSaveSucceeded) {
+    RedI& page = open();
+    correctAt(page, leftEye);
+    const QImage corrected = page.Picture1.image();
+    // A folder stands where the file belongs.
+    std::filesystem::create_directory(*machine.drives.toHost(correctedCopy));
+    page.Image8_Click();
+    ASSERT_TRUE(isOpen());
+    EXPECT_EQ(state.edit.RedMarker, u"000"_s);
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"eyes.jpg"_s));
+    EXPECT_EQ(page.Picture1.image(), corrected);
+    EXPECT_FALSE(page.busy);
+
+    std::filesystem::remove(*machine.drives.toHost(correctedCopy));
+    page.Image8_Click();
+    EXPECT_EQ(state.edit.RedMarker, u"RED"_s);
+    EXPECT_EQ(pictureIn(correctedCopy), corrected);
+}
+
+TEST_F(RedEyePage, KeepsThePictureBeforeTheLatestCorrectionAsItsUndoCopy) {
+    RedI& page = open();
+    EXPECT_FALSE(machine.files.fileExists(undoCopy));
+    correctAt(page, leftEye);
+    const QImage first = page.Picture1.image();
+    EXPECT_EQ(pictureIn(undoCopy), original);
+    correctAt(page, rightEye);
+    page.Image6_Click(); // darkened along with the correction that it belongs to
+    EXPECT_EQ(pictureIn(undoCopy), first);
+    EXPECT_NE(page.Picture1.image(), first);
+
+    page.Image7_Click();
+    EXPECT_EQ(page.Picture1.image(), first);
+    EXPECT_TRUE(page.RedChanged);
+    page.Image7_Click(); // one step and no more
+    EXPECT_EQ(page.Picture1.image(), first);
+    page.Image6_Click(); // what was taken back is not darkened
+    EXPECT_EQ(page.Picture1.image(), first);
+
+    page.Rstor_Click();
+    EXPECT_EQ(page.Picture1.image(), original);
+    EXPECT_FALSE(page.RedChanged);
+    page.Image7_Click();
+    EXPECT_EQ(page.Picture1.image(), first);
+    EXPECT_TRUE(page.RedChanged);
+    correctAt(page, QPoint(1, 1));
+    EXPECT_EQ(pictureIn(undoCopy), first);
+}
+
+TEST_F(RedEyePage, TakesBackTheOnlyCorrectionAndThenHasNothingToWrite) {
+    RedI& page = open();
+    correctAt(page, leftEye);
+    page.Image7_Click();
+    EXPECT_EQ(page.Picture1.image(), original);
+    page.Image8_Click();
+    EXPECT_EQ(state.edit.RedMarker, u"000"_s);
+    EXPECT_FALSE(machine.files.fileExists(correctedCopy));
+}
+
+TEST_F(RedEyePage, NeverTakesBackToTheCopyOfAnotherVisit) {
+    std::filesystem::create_directories(machine.drives.toHost(undoCopy)->parent_path());
+    ASSERT_TRUE(QImage(200, 150, QImage::Format_RGB32).save(host(undoCopy), "BMP"));
+    const QByteArray others = *machine.files.read(undoCopy);
+    RedI& page = open();
+    EXPECT_FALSE(page.Image7.enabled);
+    page.Image7_Click();
+    EXPECT_EQ(page.Picture1.image(), original);
+    page.Image9_Click();
+    EXPECT_EQ(*machine.files.read(undoCopy), others);
+
+    RedI& corrected = open();
+    correctAt(corrected, leftEye);
+    EXPECT_TRUE(corrected.Image7.enabled);
+    EXPECT_EQ(pictureIn(undoCopy), original);
+}
+
+TEST_F(RedEyePage, DoesNotCorrectWhatItCouldNotTakeBack) {
+    RedI& page = open();
+    pick(page, leftEye);
+    std::filesystem::remove_all(machine.drives.toHost(undoCopy)->parent_path());
+    std::ofstream(*machine.drives.toHost(u"C:\\2000lumora\\zmany\\tempred"_s)) << "in the way";
+    page.Image2_Click();
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_EQ(page.Picture1.image(), original);
+    EXPECT_FALSE(page.RedChanged);
+    std::filesystem::remove(*machine.drives.toHost(u"C:\\2000lumora\\zmany\\tempred"_s));
+    page.Image2_Click();
+    EXPECT_TRUE(page.RedChanged);
+    EXPECT_EQ(pictureIn(undoCopy), original);
+}
+
+TEST_F(RedEyePage, WorksAtTheSmallestSizeAtTheEdgeAndPartlyOutside) {
+    struct Case {
+        const char* name;
+        QPoint at;
+        int size;
+    };
+    for (const Case& circle : {Case{"smallest", leftEye, 4}, Case{"corner", {0, 0}, 40},
+                               Case{"far corner", {199, 149}, 31}, Case{"larger than the picture", {100, 75}, 200}}) {
+        RedI& page = open();
+        pick(page, circle.at);
+        setSize(page, circle.size);
+        page.amok5_Click();
+        page.Command3_Click();
+        page.Image6_Click();
+        for (int y = 0; y < original.height(); ++y) {
+            for (int x = 0; x < original.width(); ++x) {
+                const QRgb now = page.Picture1.image().pixel(x, y);
+                const bool red = original.pixel(x, y) == pupil;
+                ASSERT_TRUE(now == original.pixel(x, y) || (red && page.circle().contains(x, y)))
+                    << circle.name << ' ' << x << ',' << y;
+            }
+        }
+        page.Image7_Click();
+        page.Image5_Click();
+        EXPECT_EQ(page.Picture1.image(), original) << circle.name;
+        page.Image9_Click();
+    }
+    RedI& page = open();
+    pick(page, leftEye);
+    setSize(page, 5);
+    page.Image10_MouseDown();
+    page.Timer1_Tick();
+    page.Timer1_Tick();
+    EXPECT_EQ(page.circle().width(), RedI::smallestCircle);
+}
+
+TEST_F(RedEyePage, DarkensTheCorrectedPixelsByFiveAndForgetsThemAtANewPickOrSize) {
+    RedI& page = open();
+    pick(page, leftEye);
+    setSize(page, 20);
+    page.Image2_Click();
+    ASSERT_EQ(page.List1.count(), 81);
+    const QRgb grey = page.Picture1.image().pixel(leftEye);
+    page.Image6_Click();
+    EXPECT_EQ(page.List2.count(), 81);
+    EXPECT_EQ(qRed(page.Picture1.image().pixel(leftEye)), qRed(grey) - 5);
+    EXPECT_EQ(page.Picture1.image().pixel(leftEye + QPoint(7, 0)), skin);
+    EXPECT_TRUE(page.Label45.visible);
+    EXPECT_FALSE(page.Frame6.visible);
+    EXPECT_TRUE(page.Timer7.running());
+    EXPECT_EQ(page.Timer7.interval(), 4000);
+    page.Timer7_Tick();
+    EXPECT_FALSE(page.Label45.visible);
+    for (int press = 0; press < 60; ++press)
+        page.Frame6_Click();
+    EXPECT_LE(qRed(page.Picture1.image().pixel(leftEye)), 5);
+
+    setSize(page, 21);
+    EXPECT_TRUE(page.List1.isEmpty());
+    EXPECT_FALSE(page.Image6.enabled);
+    page.Image2_Click();
+    pick(page, rightEye);
+    EXPECT_TRUE(page.List1.isEmpty() && page.List2.isEmpty());
+}
+
+TEST_F(RedEyePage, CorrectsByHandRoundTheMiddleOrThePoint) {
+    for (const bool atPoint : {false, true}) {
+        RedI& page = open();
+        pick(page, leftEye);
+        setSize(page, 24);
+        if (atPoint)
+            page.Image1_MouseDown(RedI::Button::Right, QPointF(12, 12));
+        else
+            page.Image1_MouseUp();
+        EXPECT_TRUE(isGrey(page.Picture1.image().pixel(leftEye))) << atPoint;
+        EXPECT_EQ(page.Picture1.image().pixel(leftEye + QPoint(8, 8)), skin);
+        EXPECT_TRUE(page.RedChanged);
+        EXPECT_EQ(pictureIn(undoCopy), original);
+        page.Image7_Click();
+        EXPECT_EQ(page.Picture1.image(), original);
+        page.Image9_Click();
+    }
+}
+
+TEST_F(RedEyePage, MovesTheCircleAndThePictureUnderIt) {
+    RedI& page = open();
+    EXPECT_FALSE(page.Image2.enabled);
+    page.Image2_Click();
+    EXPECT_FALSE(page.RedChanged); // no circle, no correction
+    page.Picture3_Click({0.3, 1 / 3.0});
+    EXPECT_EQ(QPoint(page.RedSearchX, page.RedSearchY), QPoint(60, 50));
+    EXPECT_EQ(page.Picture1Left, 500 - 60 * page.Magnification);
+    EXPECT_EQ(page.Picture1Top, 400 - 50 * page.Magnification);
+
+    page.Image15_MouseDown();
+    EXPECT_EQ(page.Timer5.interval(), 100);
+    page.tickOnceIfNone();
+    page.tickOnceIfNone(); // it has ticked by now
+    page.Arrow_MouseUp();
+    EXPECT_FALSE(page.Timer5.running());
+    page.Timer2_Tick();
+    EXPECT_EQ(QPoint(page.RedSearchX, page.RedSearchY), QPoint(62, 48));
+    EXPECT_EQ(page.Picture1Left, 500 - 62 * page.Magnification); // it stays where it is in view
+    for (int tick = 0; tick < 100; ++tick)
+        page.Timer4_Tick();
+    EXPECT_EQ(page.RedSearchX, 0);
+
+    const int size = page.circle().width();
+    page.Combo1_Change(0);
+    EXPECT_EQ(page.circle().width(), size + 2);
+    EXPECT_EQ(page.Combo1.currentIndex(), 1);
+    page.Combo1_Change(2);
+    EXPECT_EQ(page.circle().width(), size);
+
+    page.Picture1_MouseDown(RedI::Button::Left, {100, 75});
+    page.Picture1_MouseMove({113, 75});
+    const double left = page.Picture1Left;
+    page.Picture1_MouseMove({126, 75});
+    EXPECT_DOUBLE_EQ(page.Picture1Left - left, 2.0 * page.Magnification);
+    page.Picture1_MouseUp({126, 75});
+    EXPECT_EQ(page.RedSearchX, 0); // a drag picks nothing
+}
+
+TEST_F(RedEyePage, ShowsTheCorrectionInTheOverviewAsIfDrawnAnew) {
+    Bitmap large(1733, 911, QColor::fromRgb(skin));
+    for (int y = 300; y < 380; ++y)
+        for (int x = 700; x < 780; ++x)
+            large.image().setPixel(x, y, qRgb(150 + (x * 7 + y * 13) % 100, 30, 40));
+    save(large);
+    RedI& page = open();
+    pick(page, {741, 339});
+    setSize(page, 71);
+    const QImage before = page.Picture3.image();
+    page.Image2_Click();
+    EXPECT_NE(page.Picture3.image(), before);
+    EXPECT_EQ(page.Picture3.image(),
+              RedOverview::draw(page.Picture1, {page.Picture3.width(), page.Picture3.height()}).image());
+    page.Image7_Click();
+    EXPECT_EQ(page.Picture3.image(), before);
+}
+
+TEST(RedEyeOverview, Is250WideOr300High) {
+    struct Case {
+        PictureSize picture, overview;
+    };
+    for (const Case& wanted :
+         {Case{{4000, 3000}, {250, 188}}, Case{{3000, 4000}, {225, 300}}, Case{{1000, 1000}, {250, 250}},
+          Case{{1000, 1080}, {250, 270}}, Case{{1, 60000}, {1, 300}}, Case{{60000, 1}, {250, 1}}})
+        EXPECT_EQ(RedOverview::size(wanted.picture), wanted.overview)
+            << wanted.picture.width << 'x' << wanted.picture.height;
+}
+
+TEST_F(RedEyePage, TellsAPictureThatCannotBeOpenedAndCloses) {
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\pics\\broken.jpg"_s, "\xFF\xD8\xFF\xE0 broken"));
+    for (const char* path : {"C:\\pics\\broken.jpg", "C:\\pics\\missing.jpg", "", "Q:\\a.jpg"}) {
+        machine.dialogs.messages.clear();
+        static_cast<RedI&>(chain.load(PageId::RedI)).open(QString::fromLatin1(path));
+        EXPECT_FALSE(isOpen()) << path;
+        EXPECT_EQ(machine.dialogs.messages.size(), 1) << path;
+    }
+}
+
+} // namespace
+} // namespace lumora
