@@ -3,6 +3,7 @@
 #include "assembly/Form2.h"
 #include "editing/BigPics.h"
 #include "editing/Form3.h"
+#include "editing/RedI.h"
 #include "editing/gdisave.h"
 #include "entry/Havharot.h"
 #include "entry/nnn.h"
@@ -31,6 +32,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::gdisave, [&] { return std::make_unique<gdisave>(state, platform, chain); });
     chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
     chain.registerPage(PageId::Form3, [&] { return std::make_unique<Form3>(state, platform, chain); });
+    chain.registerPage(PageId::RedI, [&] { return std::make_unique<RedI>(state, platform, chain); });
     chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
     chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });

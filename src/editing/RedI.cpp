@@ -331,7 +331,7 @@ void RedI::resizeCircle(int by) {
         return;
     m_circleSize = size;
     forgetLists();
-    Q_EMIT changed();
+    showState();
 }
 
 void RedI::startHold(Ticker& timer) {

@@ -22,19 +22,25 @@ void RedUndoCopy::begin(const Bitmap& picture, const std::filesystem::path& file
     });
 }
 
+Result<void> RedUndoCopy::commitWaiting() {
+    Result<void> written = m_waiting->commit(NewContent::Durability::Passing);
+    m_waiting.reset();
+    return written;
+}
+
 Result<void> RedUndoCopy::finishWriting(const Bitmap& picture) {
     if (m_rows)
         return {};
     if (m_writer.joinable())
         m_writer.join();
-    if (!m_waiting || m_waiting->failed()) {
-        // The background found no room, or no folder; there may be one by now.
+    Result<void> written = m_waiting ? commitWaiting() : Failure{};
+    if (!written) {
+        // The background found no room or no folder, or lost it since; there may be one by now.
         m_waiting.emplace(m_file, QString::fromLocal8Bit(m_file.c_str()));
         appendBmp(picture, *m_waiting, [] { return false; });
         m_differs = {};
+        written = commitWaiting();
     }
-    const Result<void> written = m_waiting->commit(NewContent::Durability::Passing);
-    m_waiting.reset();
     if (!written)
         return written;
     auto rows = BmpRows::open(m_file, picture.image().size());

@@ -46,6 +46,7 @@ public:
     void end();
 
 private:
+    Result<void> commitWaiting();
     Result<void> finishWriting(const Bitmap& picture);
 
     std::filesystem::path m_file;

@@ -1,5 +1,7 @@
 #include "editing/RedI.h"
 
+#include "editing/BigPics.h"
+#include "editing/EditRecord.h"
 #include "editing/RedOverview.h"
 #include "editing/tFrmNew.h"
 #include "session/PageChain.h"
@@ -36,6 +38,7 @@ protected:
         state.DiskRoot = machine.drives.programRoot();
         chain.registerPage(PageId::tFrmNew,
                            [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
         chain.registerPage(PageId::RedI, [this] { return std::make_unique<RedI>(state, machine.platform, chain); });
         std::filesystem::create_directories(machine.drives.dataFolder() / "pics");
         Bitmap face(200, 150, QColor::fromRgb(skin));
@@ -44,7 +47,7 @@ protected:
             painter.fillRect(QRect(eye.x() - 4, eye.y() - 4, 9, 9), QColor::fromRgb(pupil));
         painter.end();
         save(face);
-        state.edit.RedMarker = u"000"_s;
+        UnpackEditState(EditRecord::newPicture(), state.edit);
     }
 
     // Without loss, whatever the name's ending says.
@@ -178,8 +181,12 @@ TEST_F(RedEyePage, WritesNothingWithoutACorrection) {
 }
 
 TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwnAndTheNextVisitStartsFromTheCustomersFile) {
-    chain.load(PageId::tFrmNew);
-    RedI& page = open();
+    auto& editor = static_cast<tFrmNew&>(chain.load(PageId::tFrmNew));
+    editor.Command17_Click();
+    editor.Image2_Click(7);
+    ASSERT_TRUE(isOpen());
+    auto& page = static_cast<RedI&>(*chain.front());
+    EXPECT_EQ(page.caption, state.edit.PicturePath);
     correctAt(page, leftEye);
     correctAt(page, rightEye);
     const QImage corrected = page.Picture1.image();
@@ -304,7 +311,6 @@ TEST_F(RedEyePage, WorksAtTheSmallestSizeAtTheEdgeAndPartlyOutside) {
         pick(page, circle.at);
         setSize(page, circle.size);
         page.amok5_Click();
-        page.Command3_Click();
         page.Image6_Click();
         for (int y = 0; y < original.height(); ++y) {
             for (int x = 0; x < original.width(); ++x) {
@@ -314,6 +320,8 @@ TEST_F(RedEyePage, WorksAtTheSmallestSizeAtTheEdgeAndPartlyOutside) {
                     << circle.name << ' ' << x << ',' << y;
             }
         }
+        page.Command3_Click();
+        page.Image1_MouseDown(RedI::Button::Right, QPointF(-3, 2));
         page.Image7_Click();
         page.Image5_Click();
         EXPECT_EQ(page.Picture1.image(), original) << circle.name;
@@ -367,7 +375,7 @@ TEST_F(RedEyePage, CorrectsByHandRoundTheMiddleOrThePoint) {
         else
             page.Image1_MouseUp();
         EXPECT_TRUE(isGrey(page.Picture1.image().pixel(leftEye))) << atPoint;
-        EXPECT_EQ(page.Picture1.image().pixel(leftEye + QPoint(8, 8)), skin);
+        EXPECT_EQ(page.Picture1.image().pixel(rightEye), pupil);
         EXPECT_TRUE(page.RedChanged);
         EXPECT_EQ(pictureIn(undoCopy), original);
         page.Image7_Click();
@@ -406,13 +414,15 @@ TEST_F(RedEyePage, MovesTheCircleAndThePictureUnderIt) {
     page.Combo1_Change(2);
     EXPECT_EQ(page.circle().width(), size);
 
+    pick(page, {100, 75});
+    page.Picture3_Click({0.5, 0.5});
     page.Picture1_MouseDown(RedI::Button::Left, {100, 75});
     page.Picture1_MouseMove({113, 75});
     const double left = page.Picture1Left;
     page.Picture1_MouseMove({126, 75});
     EXPECT_DOUBLE_EQ(page.Picture1Left - left, 2.0 * page.Magnification);
     page.Picture1_MouseUp({126, 75});
-    EXPECT_EQ(page.RedSearchX, 0); // a drag picks nothing
+    EXPECT_EQ(page.RedSearchX, 100); // a drag picks nothing
 }
 
 TEST_F(RedEyePage, ShowsTheCorrectionInTheOverviewAsIfDrawnAnew) {
