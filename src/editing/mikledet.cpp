@@ -42,7 +42,10 @@ mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& cha
     , m_chain(chain)
     , m_timer1(moveMilliseconds, [this] { Timer1_Tick(); })
     , m_timer2(sizeMilliseconds, [this] { Timer2_Tick(); }) {
-    connect(&chain, &PageChain::shown, this, &mikledet::stopHolding);
+    connect(&chain, &PageChain::shown, this, [this] {
+        stopHolding();
+        refresh(); // another picture may have been opened since
+    });
 }
 
 void mikledet::load() {
@@ -70,7 +73,7 @@ void mikledet::setTexts() {
     Command5.text = say(u"עוד"_s, u"More"_s);
     Command7.text = u"Enter"_s;
     Command6.text = say(u"נקה Clear"_s, u"Clear"_s);
-    Command8.text = say(u"הסר טקסט מתמונה הזו"_s, u"Remove the text from this picture"_s);
+    Command8.text = say(u"הסר טקסט מתמונה הזו"_s, u"Remove this text"_s);
     Command10.text = say(u"רשימת גופנים"_s, u"Font list"_s);
     Command13.text = say(u"הודעות מוכנות"_s, u"Ready messages"_s);
     Command14.text = say(u"מקלדת"_s, u"Keyboard"_s);
@@ -96,6 +99,15 @@ void mikledet::relabel(KeyLayout::Letters to) {
     letters = to;
     for (int key = 0; key < KeyLayout::keys; ++key)
         leter[static_cast<std::size_t>(key)].text = KeyLayout::caption(key, letters);
+    refresh();
+}
+
+void mikledet::refresh() {
+    Command4.checked = letters == KeyLayout::Letters::Hebrew;
+    Command9.checked = letters == KeyLayout::Letters::Small;
+    Command2.checked = letters == KeyLayout::Letters::Capital;
+    for (int alignment = 0; alignment < 3; ++alignment)
+        Image5[static_cast<std::size_t>(alignment)].checked = m_state.edit.TextAlign == alignment;
     Q_EMIT changed();
 }
 
@@ -130,7 +142,7 @@ void mikledet::KeyPress(QChar character) {
         Command3_Click();
     } else if (const auto text = KeyLayout::typed(character)) {
         add(*text);
-    } else if (character.isPrint() || character.isSurrogate()) {
+    } else if (character.isPrint() || character.isHighSurrogate()) {
         m_platform.dialogs.message(
             m_state.wording(u"אי אפשר להדפיס את הסימן הזה"_s, u"This character can't be printed"_s));
     }
@@ -244,7 +256,7 @@ void mikledet::Image15_MouseUp() {
 void mikledet::holdSize(std::int16_t by) {
     stopHolding();
     SizeStep = by;
-    holdTicks = 0;
+    m_ticked = false;
     m_timer2.start();
 }
 
@@ -252,7 +264,7 @@ void mikledet::holdMove(std::int16_t x, std::int16_t y) {
     stopHolding();
     MoveStepX = x;
     MoveStepY = y;
-    holdTicks = 0;
+    m_ticked = false;
     m_timer1.start();
 }
 
@@ -261,8 +273,17 @@ void mikledet::stopHolding() {
     m_timer2.stop();
 }
 
+void mikledet::tickOnceIfNone() {
+    if (m_ticked)
+        return;
+    if (m_timer1.running())
+        Timer1_Tick();
+    else if (m_timer2.running())
+        Timer2_Tick();
+}
+
 void mikledet::Timer1_Tick() {
-    ++holdTicks;
+    m_ticked = true;
     EditFields& edit = m_state.edit;
     edit.TextX = HoldIn16Bits(edit.TextX + MoveStepX);
     edit.TextY = HoldIn16Bits(edit.TextY + MoveStepY);
@@ -270,7 +291,7 @@ void mikledet::Timer1_Tick() {
 }
 
 void mikledet::Timer2_Tick() {
-    ++holdTicks;
+    m_ticked = true;
     m_state.edit.TextFontSize = HoldIn16Bits(m_state.edit.TextFontSize + SizeStep);
     commitText();
 }
@@ -312,7 +333,7 @@ void mikledet::textChanged() {
 
 void mikledet::commitText() {
     static_cast<tFrmNew&>(m_chain.load(PageId::tFrmNew)).Command11_Click();
-    Q_EMIT changed();
+    refresh();
 }
 
 } // namespace lumora

@@ -58,6 +58,8 @@ public:
     void Image15_MouseUp();
     void Timer1_Tick(); // moves by the step
     void Timer2_Tick(); // changes the size by the step
+    // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
+    void tickOnceIfNone();
     // Lets go of what is held, as when the pointer is lost.
     void stopHolding();
 
@@ -79,13 +81,12 @@ public:
     std::int16_t SizeStep = 0;
     std::int16_t MoveStepX = 0;
     std::int16_t MoveStepY = 0;
-    int holdTicks = 0; // of Timer1 and Timer2 since something was last pressed down
     Caption Title;
-    Caption Command1, Command2, Command3, Command4, Command5, Command6, Command7, Command8, Command9, Command10,
-        Command13, Command14, CommandDone;
+    Caption Command1, Command3, Command5, Command6, Command7, Command8, Command10, Command13, Command14, CommandDone;
+    CheckCaption Command2, Command4, Command9; // the chosen letters are ticked
     Caption Image1, Image2, Image3, Image4;
-    std::array<Caption, 4> Image15; // left, right, up, down
-    std::array<Caption, 3> Image5;  // near, centre, far
+    std::array<Caption, 4> Image15;     // left, right, up, down
+    std::array<CheckCaption, 3> Image5; // near, centre, far
 
     static constexpr int mostLetters = 60;
 
@@ -94,6 +95,7 @@ private:
     void textChanged();
     void commitText();
     void relabel(KeyLayout::Letters to);
+    void refresh();
     void setTextOn(bool on);
     void holdSize(std::int16_t step);
     void holdMove(std::int16_t x, std::int16_t y);
@@ -103,6 +105,7 @@ private:
     PageChain& m_chain;
     Ticker m_timer1;
     Ticker m_timer2;
+    bool m_ticked = false; // since something was last pressed down
 };
 
 } // namespace lumora

@@ -95,6 +95,7 @@ QString Theme::styleSheet() const {
     static const QString sheet = QString::fromUtf8(R"(
 * { color: $Ink; font-size: @17px; }
 QWidget#lumoraWindow, QWidget[role="page"] { background: $Paper; }
+QWidget[role="panel"] { background: $Paper; border-top: 2px solid $Edge; }
 QLabel { background: transparent; }
 QLabel[type="small"] { font-size: @14px; }
 QLabel[type="muted"] { color: $Muted; }
@@ -133,6 +134,13 @@ QPushButton[role="danger"]:hover { background: $DangerSoft; border-color: $Dange
 QPushButton[role="danger"]:disabled { border-color: $Line; color: $Muted; }
 QPushButton[role="tall"] { min-height: @52px; padding: 0 @8px; font-size: @15px; }
 QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }
+QPushButton[role="done"] { border: none; background: $Primary; color: white; padding: 0 @26px; }
+QPushButton[role="done"]:hover, QPushButton[role="done"]:pressed { background: $PrimaryDark; }
+QPushButton[role="key"], QPushButton[role="wordKey"] { padding: 0; min-width: %keypx; min-height: %keypx;
+  border: 1px solid $Line; border-bottom: 2px solid $Edge; border-radius: @10px; font-size: @22px; font-weight: normal; }
+QPushButton[role="wordKey"] { font-size: @16px; font-weight: bold; }
+QPushButton[role="key"]:pressed, QPushButton[role="wordKey"]:pressed { background: $PrimarySoft; border-color: $Primary; }
+QPushButton[role="key"]:checked, QPushButton[role="wordKey"]:checked { background: $PrimarySoft; border: 2px solid $Primary; }
 
 QLineEdit, QPlainTextEdit, QComboBox { min-height: %targetpx; padding: 0 @14px; border: 2px solid $Edge; border-radius: @12px;
   background: $Surface; selection-background-color: $Primary; selection-color: white; font-size: @19px; }
