@@ -5,6 +5,7 @@
 #include "editing/Form3.h"
 #include "editing/RedI.h"
 #include "editing/gdisave.h"
+#include "editing/mikledet.h"
 #include "entry/Havharot.h"
 #include "entry/nnn.h"
 #include "platform/Platform.h"
@@ -19,6 +20,7 @@
 #include "views/MainWindow.h"
 #include "views/hatchalaView.h"
 #include "views/kyoskNewView.h"
+#include "views/mikledetView.h"
 #include "views/nnnView.h"
 
 namespace lumora {
@@ -33,6 +35,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
     chain.registerPage(PageId::Form3, [&] { return std::make_unique<Form3>(state, platform, chain); });
     chain.registerPage(PageId::RedI, [&] { return std::make_unique<RedI>(state, platform, chain); });
+    chain.registerPage(PageId::mikledet, [&] { return std::make_unique<mikledet>(state, platform, chain); });
     chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
     chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
@@ -51,6 +54,9 @@ void registerViews(MainWindow& window, SessionState& state, const Files& files) 
     });
     window.registerView(PageId::kyoskNew, [&](Page& page, const Theme& theme) {
         return std::make_unique<kyoskNewView>(static_cast<kyoskNew&>(page), state, theme);
+    });
+    window.registerView(PageId::mikledet, [&](Page& page, const Theme& theme) {
+        return std::make_unique<mikledetView>(static_cast<mikledet&>(page), state, theme);
     });
     window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
         return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);
