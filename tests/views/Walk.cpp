@@ -250,7 +250,7 @@ QStringList Walk::faults(bool english) {
             if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
                 result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
         }
-        if (english) {
+        if (english && !widget->property("letterOfAnyLanguage").toBool()) {
             QString said = widget->accessibleName() + widget->toolTip();
             if (button)
                 said += button->text();

@@ -1,0 +1,240 @@
+#include "editing/mikledet.h"
+
+#include "editing/EditRecord.h"
+#include "editing/tFrmNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+
+namespace lumora {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+class CaptionKeys : public ::testing::Test {
+protected:
+    CaptionKeys()
+        : chain(machine.pump) {
+        state.DiskRoot = machine.drives.programRoot();
+        chain.registerPage(PageId::tFrmNew, [this] {
+            auto page = std::make_unique<tFrmNew>(state, machine.platform, chain);
+            QObject::connect(page.get(), &tFrmNew::stored, page.get(), [this] { ++stores; });
+            return page;
+        });
+        chain.registerPage(PageId::mikledet,
+                           [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
+        UnpackEditState(EditRecord::newPicture(), state.edit);
+        state.edit.TextOn = 1;
+        state.edit.TextFontSize = 24;
+        state.edit.TextX = 100;
+        state.edit.TextY = 100;
+        chain.show(PageId::tFrmNew);
+        chain.show(PageId::mikledet);
+        stores = 0;
+    }
+
+    mikledet& page() { return static_cast<mikledet&>(chain.load(PageId::mikledet)); }
+    // What the stored record gives back.
+    EditFields stored() const {
+        EditFields fields;
+        UnpackEditState(state.edit.EditState, fields);
+        return fields;
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+    int stores = 0;
+};
+
+TEST_F(CaptionKeys, theSixtyFirstLetterIsRefusedWhileSpaceAndEnterGoOn) {
+    for (int i = 0; i < 60; ++i)
+        page().leter_Click(12);
+    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
+    page().leter_Click(12);
+    EXPECT_EQ(machine.dialogs.messages, QStringList{u"עד  60  אותיות"_s});
+    EXPECT_EQ(stores, 60);
+    page().Command1_Click();
+    page().Command7_Click();
+    EXPECT_EQ(page().Text1.text, QString(60, u'ש') + u" \r\n"_s);
+    EXPECT_EQ(state.edit.TextBody, page().Text1.text);
+    state.EnglishTips = 1;
+    page().KeyPress(u'x');
+    EXPECT_EQ(machine.dialogs.messages.last(), u"Up to 60 letters"_s);
+    EXPECT_EQ(stored().TextBody.size(), 63) << "the record has room for 70";
+}
+
+TEST_F(CaptionKeys, aBlankReachesThePictureWithTheNextKey) {
+    page().leter_Click(7);
+    page().Command1_Click();
+    EXPECT_EQ(page().Text1.text, u"א "_s);
+    EXPECT_EQ(state.edit.TextBody, u"א"_s);
+    EXPECT_EQ(stores, 1);
+    page().leter_Click(19);
+    EXPECT_EQ(stored().TextBody, u"א ב"_s);
+    // A key without a letter types a blank as a letter.
+    page().leter_Click(11);
+    EXPECT_EQ(state.edit.TextBody, u"א ב "_s);
+    EXPECT_EQ(stores, 3);
+}
+
+TEST_F(CaptionKeys, takesBackOneCharacterAndClearsAll) {
+    page().Command3_Click();
+    EXPECT_EQ(stores, 0) << "nothing to take back";
+    page().leter_Click(7);
+    page().leter_Click(19);
+    page().Command3_Click();
+    EXPECT_EQ(stored().TextBody, u"א"_s);
+    page().Command5_Click();
+    EXPECT_TRUE(page().Frame1.visible);
+    page().Command6_Click();
+    EXPECT_FALSE(page().Frame1.visible);
+    EXPECT_TRUE(page().Text1.text.isEmpty());
+    EXPECT_TRUE(stored().TextBody.isEmpty());
+    page().Command5_Click();
+    page().leter_Click(KeyLayout::firstSymbol);
+    EXPECT_FALSE(page().Frame1.visible);
+}
+
+TEST_F(CaptionKeys, lettersChangeOnTheirKeysAndDigitsStay) {
+    for (const auto& [press, letter] :
+         {std::pair{&mikledet::Command2_Click, u"G"_s}, std::pair{&mikledet::Command9_Click, u"g"_s},
+          std::pair{&mikledet::Command4_Click, u"ע"_s}}) {
+        page().Command6_Click();
+        (page().*press)();
+        page().leter_Click(0);
+        page().leter_Click(KeyLayout::firstDigit + 7);
+        EXPECT_EQ(state.edit.TextBody, letter + u'7');
+    }
+}
+
+TEST_F(CaptionKeys, removingTheTextKeepsItForLater) {
+    page().leter_Click(7);
+    page().Command8_Click();
+    EXPECT_FALSE(page().Check4.checked);
+    EXPECT_EQ(stored().TextOn, 0);
+    EXPECT_EQ(stored().TextBody, u"א"_s);
+    page().Check4_Click(true);
+    EXPECT_EQ(stored().TextOn, 1);
+    EXPECT_EQ(stored().TextBody, u"א"_s);
+}
+
+TEST_F(CaptionKeys, sizeAndPlaceStepByTwoForEachTick) {
+    page().Image1_MouseDown();
+    page().Timer2_Tick();
+    page().Timer2_Tick();
+    page().tickOnceIfNone();
+    page().Image1_MouseUp();
+    page().tickOnceIfNone();
+    EXPECT_EQ(state.edit.TextFontSize, 28) << "a tick of its own is enough";
+    page().Image2_MouseDown();
+    page().tickOnceIfNone();
+    page().Image2_MouseUp();
+    EXPECT_EQ(state.edit.TextFontSize, 26) << "a short tap is one step";
+    struct Case {
+        int direction, x, y;
+    };
+    for (const Case& given : {Case{0, 98, 100}, Case{1, 100, 100}, Case{2, 100, 98}, Case{3, 100, 100}}) {
+        page().Image15_MouseDown(given.direction);
+        page().tickOnceIfNone();
+        page().Image15_MouseUp();
+        EXPECT_EQ(stored().TextX, given.x);
+        EXPECT_EQ(stored().TextY, given.y);
+    }
+    EXPECT_EQ(stores, 7);
+    // What has no limit is cut by the record, and a font is never smaller than 8.
+    state.edit.TextFontSize = 98;
+    page().Image1_MouseDown();
+    page().Timer2_Tick();
+    EXPECT_EQ(state.edit.TextFontSize, 100);
+    EXPECT_EQ(stored().TextFontSize, 10);
+    state.edit.TextFontSize = 8;
+    page().Image2_MouseDown();
+    page().Timer2_Tick();
+    EXPECT_EQ(state.edit.TextFontSize, 6);
+    EXPECT_EQ(stored().TextFontSize, 8);
+    state.edit.TextX = 32767;
+    page().Image15_MouseDown(1);
+    page().Timer1_Tick();
+    EXPECT_EQ(state.edit.TextX, 32767);
+}
+
+TEST_F(CaptionKeys, whatIsHeldLetsGoWhenAnotherPageComes) {
+    page().Image1_MouseDown();
+    chain.show(PageId::tFrmNew);
+    page().tickOnceIfNone();
+    EXPECT_EQ(state.edit.TextFontSize, 24);
+}
+
+TEST_F(CaptionKeys, styleDirectionAndAlignmentGoTheirRounds) {
+    QList<int> styles;
+    for (int i = 0; i < 4; ++i) {
+        page().Image3_Click();
+        styles += stored().TextStyle;
+    }
+    EXPECT_EQ(styles, (QList<int>{1, 2, 3, 0}));
+    QList<int> directions;
+    for (int i = 0; i < 2; ++i) {
+        page().Image4_Click();
+        directions += stored().TextVertical;
+    }
+    EXPECT_EQ(directions, (QList<int>{3, 0}));
+    for (const int alignment : {2, 1, 0}) {
+        page().Image5_Click(alignment);
+        EXPECT_EQ(stored().TextAlign, alignment);
+        EXPECT_TRUE(page().Image5[static_cast<std::size_t>(alignment)].checked);
+    }
+    EXPECT_EQ(stores, 9);
+}
+
+TEST_F(CaptionKeys, thePaletteGivesTheColourOfThePressedPixel) {
+    const QImage& palette = page().Picture18Image.image();
+    for (const QPoint at : {QPoint(0, 0), QPoint(palette.width() / 2, 20), palette.rect().bottomRight()}) {
+        page().Picture18_MouseDown(at);
+        const EditFields kept = stored();
+        EXPECT_EQ(qRgb(kept.TextRed, kept.TextGreen, kept.TextBlue), palette.pixel(at));
+    }
+    stores = 0;
+    page().Picture18_MouseDown({palette.width(), 0});
+    EXPECT_EQ(stores, 0);
+}
+
+TEST_F(CaptionKeys, theFontListHoldsOneFont) {
+    state.edit.TextFont = u"Arial"_s;
+    page().Command10_Click();
+    page().Command10_Click();
+    EXPECT_EQ(page().Combo1List.items(), QStringList{u"David"_s});
+    EXPECT_EQ(stored().TextFont, u"David"_s);
+}
+
+TEST_F(CaptionKeys, aRealKeyboardDoesWhatTheKeysDo) {
+    for (const QChar character : u"Ab \"ש\rx\b"_s)
+        page().KeyPress(character);
+    EXPECT_EQ(stored().TextBody, page().Text1.text);
+    EXPECT_EQ(page().Text1.text, u"Ab \u05F4ש\r\n"_s);
+    page().KeyPress(u'\u0416');
+    for (const QChar half : QString::fromUcs4(U"\U0001F600"))
+        page().KeyPress(half);
+    EXPECT_EQ(machine.dialogs.messages.size(), 2) << "one for each character that can't be printed";
+    EXPECT_EQ(page().Text1.text, u"Ab \u05F4ש\r\n"_s);
+}
+
+TEST_F(CaptionKeys, beginsWithTheCaptionOfThePicture) {
+    state.edit.TextBody = u"שלום"_s;
+    chain.unload(PageId::mikledet);
+    EXPECT_EQ(page().Text1.text, u"שלום"_s);
+    EXPECT_TRUE(page().Check4.checked);
+    chain.unload(PageId::mikledet);
+    state.edit.TextOn = 0;
+    EXPECT_TRUE(page().Text1.text.isEmpty());
+    EXPECT_FALSE(page().Check4.checked);
+    EXPECT_EQ(state.edit.TextFont, u"David"_s);
+    EXPECT_EQ(state.edit.TextFontSize, 14);
+}
+
+} // namespace
+} // namespace lumora

@@ -1,0 +1,81 @@
+#include "Walk.h"
+
+#include "editing/mikledet.h"
+#include "editing/tFrmNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "views/MainWindow.h"
+#include "views/PageView.h"
+
+#include <QTest>
+#include <QWidget>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+struct Screen {
+    QSize size;
+    bool english;
+};
+
+void PrintTo(const Screen& screen, std::ostream* out) {
+    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
+}
+
+class CaptionKeyboard : public ::testing::TestWithParam<Screen> {
+protected:
+    void look(Walk& walk, const QString& name) {
+        walk.settle(60);
+        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
+        for (const QString& fault : walk.faults(GetParam().english))
+            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
+    }
+};
+
+} // namespace
+
+TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
+    Walk walk(GetParam().size);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    PageChain& chain = walk.program().chain();
+    SessionState& state = walk.program().state();
+    if (!chain.isRegistered(PageId::tFrmNew))
+        chain.registerPage(PageId::tFrmNew,
+                           [&] { return std::make_unique<tFrmNew>(state, walk.program().platform(), chain); });
+    state.edit.TextOn = 1;
+    chain.show(PageId::mikledet);
+    auto& page = walk.page<mikledet>(PageId::mikledet);
+    page.Check4_Click(true);
+    look(walk, u"30-keyboard"_s);
+    MainWindow& window = walk.program().window();
+    EXPECT_LE(window.frontView()->height(), window.height() * 48 / 100);
+
+    const ControlFinder finder(window);
+    const auto press = [&](int key) {
+        const Result<void> done = finder.press(u"mikledet"_s, u"leter(%1)"_s.arg(key));
+        EXPECT_TRUE(done.ok()) << (done ? "" : qPrintable(done.failure().message));
+    };
+    for (int key = 0; key < KeyLayout::firstSymbol; ++key)
+        press(key);
+    EXPECT_EQ(page.Text1.text.size(), KeyLayout::firstSymbol);
+    look(walk, u"31-keyboard-text"_s);
+    walk.press(u"mikledet"_s, u"Command5"_s);
+    look(walk, u"32-keyboard-symbols"_s);
+    for (int key = KeyLayout::firstSymbol; key < KeyLayout::keys; ++key) {
+        press(key);
+        EXPECT_TRUE(finder.press(u"mikledet"_s, u"Command5"_s).ok());
+    }
+    EXPECT_EQ(page.Text1.text.size(), 60);
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard,
+                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
+                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+
+} // namespace lumora
