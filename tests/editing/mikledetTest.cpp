@@ -1,9 +1,12 @@
 #include "editing/mikledet.h"
 
+#include "editing/BigPics.h"
 #include "editing/EditRecord.h"
 #include "editing/tFrmNew.h"
+#include "imaging/PictureFile.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/Workspace.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -20,20 +23,23 @@ protected:
     CaptionKeys()
         : chain(machine.pump) {
         state.DiskRoot = machine.drives.programRoot();
-        chain.registerPage(PageId::tFrmNew, [this] {
-            auto page = std::make_unique<tFrmNew>(state, machine.platform, chain);
-            QObject::connect(page.get(), &tFrmNew::stored, page.get(), [this] { ++stores; });
-            return page;
-        });
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.Bord = u"NB"_s;
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
+        const QString picture = u"C:\\picture.jpg"_s;
+        EXPECT_TRUE(saveJpeg(Bitmap(400, 300, Qt::gray), *machine.drives.toHost(picture), 95));
+        chain.registerPage(PageId::tFrmNew,
+                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
         chain.registerPage(PageId::mikledet,
                            [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
+        auto& editor = static_cast<tFrmNew&>(chain.load(PageId::tFrmNew));
+        QObject::connect(&editor, &tFrmNew::stored, &editor, [this] { ++stores; });
         UnpackEditState(EditRecord::newPicture(), state.edit);
-        state.edit.TextOn = 1;
-        state.edit.TextFontSize = 24;
-        state.edit.TextX = 100;
-        state.edit.TextY = 100;
+        state.edit.PicturePath = picture;
         chain.show(PageId::tFrmNew);
-        chain.show(PageId::mikledet);
+        editor.Command17_Click();
+        editor.Command8_Click();
         stores = 0;
     }
 
