@@ -338,7 +338,7 @@ void tFrmNew::Command23_Click() {
 }
 
 void tFrmNew::setPreviewScale(double scale) {
-    const double held = std::clamp(scale, 1.0, 3.0);
+    const double held = std::clamp(scale, 1.0, 2.0);
     if (held == m_scale)
         return;
     m_scale = held;

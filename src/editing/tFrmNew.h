@@ -46,7 +46,7 @@ public:
 
     // --- events ---
 
-    // How many real pixels a logical pixel of the paper has on this screen, 1 to 3. Best told before a picture is
+    // How many real pixels a logical pixel of the paper has on this screen, 1 to 2. Best told before a picture is
     // opened: no more pixels are read of it than the scale asks for.
     void setPreviewScale(double scale);
 
