@@ -36,7 +36,10 @@ tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain
     , Timer3(holdMilliseconds, [this] { Timer3_Tick(); })
     , Timer6(holdMilliseconds, [this] { Timer6_Tick(); })
     , Timer7(holdMilliseconds, [this] { Timer7_Tick(); })
-    , Timer8(holdMilliseconds, [this] { Timer8_Tick(); }) {}
+    , Timer8(holdMilliseconds, [this] { Timer8_Tick(); }) {
+    // Whatever comes to the front, nobody holds a button of this page any more.
+    connect(&chain, &PageChain::shown, this, &tFrmNew::stopHolds);
+}
 
 tFrmNew::~tFrmNew() = default;
 

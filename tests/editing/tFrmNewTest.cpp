@@ -291,7 +291,20 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
 
     editor.Image2_MouseDown(0);
     editor.Timer2_Tick();
-    open(standing);
+    chain.show(PageId::kyoskNew);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("106"));
+    editor.Timer2_Tick();
+    EXPECT_EQ(state.edit.ZoomPercent, 106);
+
+    editor.Image2_MouseDown(0);
+    editor.Timer2_Tick();
+    UnpackEditState(EditRecord::newPicture(), state.edit);
+    state.edit.PicturePath = standing;
+    stored.clear();
+    editor.Command17_Click();
+    ASSERT_EQ(stored.size(), 1);
+    EXPECT_TRUE(stored.last().contains(QStringLiteral("180100150 225 ")));
+    stored.clear();
     editor.Image2_MouseUp(0);
     EXPECT_EQ(state.edit.ZoomPercent, 100);
     EXPECT_TRUE(stored.isEmpty());
@@ -406,7 +419,8 @@ TEST_F(TheEditor, readsBadRecordsAsThePictureWithoutThatEdit) {
          {Case{EditRecord::ZoomPercent, "xx"}, Case{EditRecord::ZoomPercent, "999"}, Case{EditRecord::PanX, "ab"},
           Case{EditRecord::RotationCode, "?"}, Case{EditRecord::FrameFolder, ".."},
           Case{EditRecord::FrameFolder, "\\p"}, Case{EditRecord::ToneFlag, "x"}, Case{EditRecord::GainG, "eee"}}) {
-        tFrmNew& editor = open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, QStringLiteral("003")));
+        tFrmNew& editor =
+            open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, QStringLiteral("003")));
         EXPECT_TRUE(editor.pictureOpen()) << c.value;
         EXPECT_LT(corner().green(), 100) << c.value;
     }
