@@ -27,6 +27,14 @@ void PrintTo(const Screen& screen, std::ostream* out) {
     *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
 }
 
+void offerEditor(Walk& walk) {
+    Program& program = walk.program();
+    if (!program.chain().isRegistered(PageId::tFrmNew))
+        program.chain().registerPage(PageId::tFrmNew, [&program] {
+            return std::make_unique<tFrmNew>(program.state(), program.platform(), program.chain());
+        });
+}
+
 class CaptionKeyboard : public ::testing::TestWithParam<Screen> {
 protected:
     void look(Walk& walk, const QString& name) {
@@ -45,9 +53,7 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
         walk.press(u"hatchala"_s, u"Check1"_s);
     PageChain& chain = walk.program().chain();
     SessionState& state = walk.program().state();
-    if (!chain.isRegistered(PageId::tFrmNew))
-        chain.registerPage(PageId::tFrmNew,
-                           [&] { return std::make_unique<tFrmNew>(state, walk.program().platform(), chain); });
+    offerEditor(walk);
     state.edit.TextOn = 1;
     chain.show(PageId::mikledet);
     auto& page = walk.page<mikledet>(PageId::mikledet);
@@ -72,6 +78,41 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
         EXPECT_TRUE(finder.press(u"mikledet"_s, u"Command5"_s).ok());
     }
     EXPECT_EQ(page.Text1.text.size(), 60);
+}
+
+TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
+    Walk walk({1024, 768});
+    SessionState& state = walk.program().state();
+    PageChain& chain = walk.program().chain();
+    offerEditor(walk);
+    state.edit.TextFontSize = 24;
+    state.edit.TextOn = 1;
+    chain.show(PageId::mikledet);
+    auto& page = walk.page<mikledet>(PageId::mikledet);
+    walk.type(u"mikledet"_s, u"Text1"_s, u"שלום 24"_s);
+    EXPECT_EQ(state.edit.TextBody, u"שלום 24"_s);
+    walk.type(u"mikledet"_s, u"Text1"_s, u"a\nb"_s);
+    EXPECT_EQ(state.edit.TextBody, u"a\r\nb"_s) << "typing replaces";
+    walk.press(u"mikledet"_s, u"leter(%1)"_s.arg(KeyLayout::firstDigit + 5));
+    EXPECT_EQ(page.Text1.text, u"a\r\nb5"_s);
+    QTest::keyClick(walk.program().window().frontView(), Qt::Key_Backspace);
+    EXPECT_EQ(page.Text1.text, u"a\r\nb"_s) << "wherever the keyboard is";
+
+    walk.press(u"mikledet"_s, u"Image1"_s);
+    EXPECT_EQ(state.edit.TextFontSize, 26);
+    const auto y = state.edit.TextY;
+    walk.press(u"mikledet"_s, u"Image15(2)"_s);
+    EXPECT_EQ(state.edit.TextY, y - 2);
+
+    const QImage& palette = page.Picture18Image.image();
+    for (const double percent : {3.0, 40.0, 97.0}) {
+        const ControlFinder finder(walk.program().window());
+        EXPECT_TRUE(finder.pressAt(u"mikledet"_s, u"Picture18"_s, {percent, 50}).ok());
+        const QRgb wanted = palette.pixel(static_cast<int>(palette.width() * percent / 100), palette.height() / 2);
+        EXPECT_EQ(qRgb(state.edit.TextRed, state.edit.TextGreen, state.edit.TextBlue), wanted) << percent;
+    }
+    QTest::keyClick(walk.program().window().frontView(), Qt::Key_Escape);
+    EXPECT_EQ(chain.front()->id(), PageId::tFrmNew);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard,
