@@ -256,6 +256,13 @@ void mikledetView::sayAll() {
     speak(control(u"Command2"_s)->widget, wording(u"אותיות גדולות באנגלית"_s, u"Capital letters"_s));
 }
 
+void mikledetView::showIcon(QPushButton* button, const QString& icon) {
+    if (button->property("shownIcon") == icon)
+        return; // a button that is given its icon again paints itself again
+    button->setProperty("shownIcon", icon);
+    setIcon(button, icon, Theme::Colour::Ink);
+}
+
 void mikledetView::render() {
     const EditFields& edit = state().edit;
     sayAll();
@@ -264,8 +271,8 @@ void mikledetView::render() {
     m_row->setCurrentIndex(m_page.Frame1.visible ? 1 : 0);
     m_palette->show(m_page.Picture18Image.image(), qRgb(edit.TextRed, edit.TextGreen, edit.TextBlue));
     static constexpr const char* styles[] = {"letter-regular", "letter-bold", "letter-italic", "letter-bold-italic"};
-    setIcon(m_style, QString::fromLatin1(styles[edit.TextStyle & 3]), Theme::Colour::Ink);
-    setIcon(m_direction, edit.TextVertical == 3 ? u"text-down"_s : u"text-across"_s, Theme::Colour::Ink);
+    showIcon(m_style, QString::fromLatin1(styles[edit.TextStyle & 3]));
+    showIcon(m_direction, edit.TextVertical == 3 ? u"text-down"_s : u"text-across"_s);
     // A key without a letter types a blank and shows the sign of one.
     for (QPushButton* made : m_keys) {
         const bool blank = made->text().isEmpty();

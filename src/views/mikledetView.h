@@ -34,6 +34,7 @@ private:
     template <class Down, class Up>
     QPushButton* holdButton(const QString& name, const Caption& caption, const QString& icon, Down down, Up up);
     void sayAll();
+    void showIcon(QPushButton* button, const QString& icon);
 
     mikledet& m_page;
     CaptionField* m_text = nullptr;
