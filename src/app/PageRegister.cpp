@@ -15,6 +15,7 @@
 #include "transfer/FtpFrm.h"
 #include "transfer/InetForm.h"
 #include "views/Form2View.h"
+#include "views/Form3View.h"
 #include "views/FtpFrmView.h"
 #include "views/HavharotView.h"
 #include "views/MainWindow.h"
@@ -60,6 +61,9 @@ void registerViews(MainWindow& window, SessionState& state, const Files& files) 
     });
     window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
         return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);
+    });
+    window.registerView(PageId::Form3, [&](Page& page, const Theme& theme) {
+        return std::make_unique<Form3View>(static_cast<Form3&>(page), state, theme);
     });
     window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
         return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);

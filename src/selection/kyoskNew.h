@@ -52,6 +52,7 @@ public:
     void Image15_Click();   // previous page
     void Command14_Click(); // only what was chosen
     void Image4_Click();    // turns the large view by 90 degrees
+    void Picture2_Click();  // opens the picture of the large view on a page of its own
     void Image6_Click();    // opens and closes the help panel Frame2
     void Image11_Click();   // price list
     void Image17_Click();   // price list, on the closing panel

@@ -1,5 +1,6 @@
 // The page of pictures: finding folders, turning pages, drawing small pictures and the large view.
 #include "common/DrivePathText.h"
+#include "editing/Form3.h"
 #include "editing/StoredSmallView.h"
 #include "imaging/PictureFile.h"
 #include "platform/Dialogs.h"
@@ -7,6 +8,7 @@
 #include "platform/Platform.h"
 #include "selection/PrintQuality.h"
 #include "selection/kyoskNew.h"
+#include "session/PageChain.h"
 #include "session/SessionState.h"
 
 #include <QTransform>
@@ -287,6 +289,13 @@ void kyoskNew::Image4_Click() {
     m_rotation = (m_rotation + 90) % 360;
     showLarge(Label2.text);
     Q_EMIT changed();
+}
+
+void kyoskNew::Picture2_Click() {
+    if (Picture2.bitmap.isNull())
+        return;
+    static_cast<Form3&>(m_chain.load(PageId::Form3)).showPicture(Label2.text);
+    m_chain.show(PageId::Form3);
 }
 
 void kyoskNew::Image6_Click() {

@@ -1,6 +1,10 @@
 #include "views/LargePicture.h"
 
+#include <QKeyEvent>
+#include <QMouseEvent>
 #include <QPainter>
+
+#include <utility>
 
 namespace lumora {
 
@@ -12,13 +16,31 @@ LargePicture::LargePicture(const Theme& theme, QWidget* parent)
     setMinimumSize(theme.px(180), theme.px(120));
 }
 
-void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning) {
+void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning, const QString& meaning) {
     m_view = view;
     m_warning = warning;
     setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified()
-                      : view.warning       ? warning
-                                           : u" "_s.trimmed());
+                      : view.warning       ? meaning + u". "_s + warning
+                                           : meaning);
+    setCursor(view.bitmap.isNull() ? Qt::ArrowCursor : Qt::PointingHandCursor);
+    setFocusPolicy(view.bitmap.isNull() ? Qt::NoFocus : Qt::TabFocus);
     update();
+}
+
+void LargePicture::mousePressEvent(QMouseEvent* event) {
+    m_pressed = event->button() == Qt::LeftButton && !m_view.bitmap.isNull();
+}
+
+void LargePicture::mouseReleaseEvent(QMouseEvent* event) {
+    if (std::exchange(m_pressed, false) && rect().contains(event->position().toPoint()))
+        Q_EMIT clicked();
+}
+
+void LargePicture::keyPressEvent(QKeyEvent* event) {
+    const bool press = event->key() == Qt::Key_Space || event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
+    if (!press || m_view.bitmap.isNull())
+        return QWidget::keyPressEvent(event);
+    Q_EMIT clicked();
 }
 
 void LargePicture::paintEvent(QPaintEvent*) {
@@ -55,6 +77,14 @@ void LargePicture::paintEvent(QPaintEvent*) {
     QRectF at(QPointF(), fit);
     at.moveCenter(QRectF(rect()).center());
     painter.drawImage(at, picture);
+    const int sign = m_theme.px(34);
+    const QRectF plate(at.right() - sign - m_theme.px(8), at.bottom() - sign - m_theme.px(8), sign, sign);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(QColor(255, 255, 255, 215));
+    painter.drawEllipse(plate);
+    const int inset = m_theme.px(6);
+    painter.drawPixmap(plate.topLeft() + QPointF(inset, inset),
+                       m_theme.icon(u"look"_s, sign - 2 * inset, Theme::Colour::Ink));
     if (!m_view.warning)
         return;
     painter.setFont(m_theme.font(Theme::Type::Small));

@@ -178,6 +178,7 @@ QWidget* kyoskNewView::makeSide() {
     inside->setSpacing(theme().px(6));
     m_large = new LargePicture(theme(), card);
     bind(u"Picture2"_s, m_large, [this] { return m_page.Picture2.guide.join(u'\n'); });
+    connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
     inside->addWidget(m_large, 1);
     auto* grade = label(u"Label6"_s, m_page.Label6, "strong");
     grade->setAlignment(Qt::AlignCenter);
@@ -550,8 +551,9 @@ void kyoskNewView::render() {
         line += u"  ·  "_s + wording(u"%1 תמונות"_s, u"%1 pictures"_s).arg(m_page.Label34.text.trimmed());
     m_folder->setText(line);
     renderCells();
-    m_large->show(m_page.Picture2, wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s,
-                                           u"Few pixels: the print may come out blurred"_s));
+    m_large->show(m_page.Picture2,
+                  wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s, u"Few pixels: the print may come out blurred"_s),
+                  wording(u"הצגת התמונה בגדול"_s, u"Look at the picture in large"_s));
     m_turn->setVisible(m_page.Image4.visible && !m_page.Picture2.bitmap.isNull());
     setDirectedIcon(m_previous, false);
     setDirectedIcon(m_next, true);

@@ -96,6 +96,13 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
     walk.press(u"kyoskNew"_s, u"Image5"_s);
     walk.choosePictures();
     look(walk, u"12-pictures"_s);
+    walk.press(u"kyoskNew"_s, u"Picture2"_s);
+    walk.waitFor(u"Form3"_s);
+    look(walk, u"12-upright"_s);
+    walk.press(u"Form3"_s, u"Command1"_s);
+    look(walk, u"12-turned"_s);
+    walk.press(u"Form3"_s, u"Command3"_s);
+    walk.waitFor(u"kyoskNew"_s);
     walk.press(u"kyoskNew"_s, u"Image6"_s);
     look(walk, u"13-help"_s);
     walk.press(u"kyoskNew"_s, u"helpClose"_s);

@@ -1,0 +1,147 @@
+#include "editing/BigPics.h"
+#include "editing/Form3.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+// Left half and right half.
+Bitmap halves(int width, int height, QColor left, QColor right) {
+    Bitmap picture(width, height, left);
+    for (int y = 0; y < height; ++y) {
+        for (int x = width / 2; x < width; ++x)
+            picture.image().setPixelColor(x, y, right);
+    }
+    return picture;
+}
+
+TEST(SampleColorLevels, AddsOneZeroToWhatIsUnderAHundredSoThatTextOrderPutsTheBrightestLast) {
+    EXPECT_EQ(SampleColorLevels::itemText(0), QStringLiteral("00"));
+    EXPECT_EQ(SampleColorLevels::itemText(5), QStringLiteral("05"));
+    EXPECT_EQ(SampleColorLevels::itemText(50), QStringLiteral("050"));
+    EXPECT_EQ(SampleColorLevels::itemText(100), QStringLiteral("100"));
+    EXPECT_LT(SampleColorLevels::itemText(5), SampleColorLevels::itemText(50));
+    EXPECT_LT(SampleColorLevels::itemText(50), SampleColorLevels::itemText(200));
+
+    Bitmap row(11, 1, Qt::black);
+    row.image().setPixelColor(0, 0, QColor(200, 0, 9));
+    row.image().setPixelColor(5, 0, QColor(5, 0, 10));
+    row.image().setPixelColor(10, 0, QColor(50, 0, 99));
+    const SampleColorLevels samples(row, {0, 0, 10, 0});
+    EXPECT_EQ(samples.lists()[0], QStringList({QStringLiteral("05"), QStringLiteral("050"), QStringLiteral("200")}));
+    EXPECT_EQ(samples.lists()[2], QStringList({QStringLiteral("010"), QStringLiteral("09"), QStringLiteral("099")}));
+}
+
+TEST(SampleColorLevels, GivesTopLevelsGainsAndFloorsOfAFlatPicture) {
+    struct Case {
+        QColor colour;
+        ChannelValues top, gain, floor;
+    };
+    for (const Case& c : {
+             Case{QColor(0, 0, 0), {0.2F, 0.2F, 0.2F}, {1275, 1275, 1275}, {10, 10, 10}},
+             Case{QColor(255, 255, 255), {255.2F, 255.2F, 255.2F}, {0.99922F, 0.99922F, 0.99922F}, {265, 265, 265}},
+             Case{QColor(200, 50, 5), {200.2F, 50.2F, 5.2F}, {1.27373F, 5.07968F, 49.0385F}, {210, 60, 15}},
+         }) {
+        const SampleColorLevels samples(Bitmap(60, 40, c.colour), {5, 5, 50, 30});
+        for (std::size_t channel = 0; channel < 3; ++channel) {
+            EXPECT_FLOAT_EQ(samples.topLevels()[channel], c.top[channel]);
+            EXPECT_NEAR(samples.gains()[channel], c.gain[channel], c.gain[channel] * 1e-5);
+            EXPECT_FLOAT_EQ(samples.floors(10)[channel], c.floor[channel]);
+        }
+    }
+}
+
+class WorkSurfaces : public ::testing::Test {
+protected:
+    WorkSurfaces()
+        : chain(machine.pump) {
+        state.DiskRoot = machine.drives.programRoot();
+        chain.registerPage(PageId::Form3, [this] { return std::make_unique<Form3>(state, machine.platform, chain); });
+    }
+    QString picture(const char* name, const Bitmap& bitmap) {
+        const QString path = QStringLiteral("C:\\") + QString::fromLatin1(name);
+        EXPECT_TRUE(bitmap.image().save(toText(*machine.drives.toHost(path)), "BMP"));
+        return path;
+    }
+    EditedPreview opened(const QString& path) {
+        return *EditedPreview::open(*machine.drives.toHost(path), {10, 15}, 100, EditedPreview::Tone::Colour);
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+    BigPics surfaces;
+};
+
+TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
+    surfaces.CipCip = opened(picture("wide.bmp", halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140))));
+    const QImage before = surfaces.CipCip->workPicture().image().copy();
+    surfaces.Command2_Click();
+    EXPECT_EQ(surfaces.Picture2.image().size(), QSize(400, 200));
+    EXPECT_EQ(surfaces.Image_crop, QRect(50, 25, 300, 150));
+    EXPECT_EQ(surfaces.List1.count(), 61 * 31);
+    EXPECT_EQ(surfaces.List1.item(0), QStringLiteral("020"));
+    EXPECT_EQ(surfaces.List3.item(surfaces.List3.lastIndex()), QStringLiteral("140"));
+    EXPECT_NEAR(surfaces.levels.gains[0], 255 / 220.2, 1e-4);
+    EXPECT_EQ(surfaces.levels.floors, (ChannelValues{30, 50, 70}));
+    EXPECT_EQ(surfaces.CipCip->workPicture().image(), before);
+
+    surfaces.Command2_Click();
+    EXPECT_EQ(surfaces.List1.count(), 61 * 31) << "the lists start afresh";
+}
+
+TEST_F(WorkSurfaces, TurnGreyWithEqualWeights) {
+    surfaces.CipCip = opened(picture("flat.bmp", Bitmap(90, 60, QColor(200, 100, 50))));
+    surfaces.Command1_Click();
+    EXPECT_EQ(surfaces.CipCip->workPicture().image().pixelColor(40, 30), QColor(105, 105, 105));
+    surfaces.Picture1 = Bitmap(4, 4, Qt::white);
+    surfaces.Picture1Grey_Click();
+    EXPECT_EQ(surfaces.Picture1.image().pixelColor(1, 1), QColor(229, 229, 229));
+}
+
+TEST_F(WorkSurfaces, DoNothingBeforeAPictureIsOpened) {
+    surfaces.Command1_Click();
+    surfaces.Command2_Click();
+    surfaces.Picture1Grey_Click();
+    EXPECT_TRUE(surfaces.List1.isEmpty());
+    EXPECT_TRUE(surfaces.Picture1.isNull());
+}
+
+TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
+    auto& look = static_cast<Form3&>(chain.load(PageId::Form3));
+    const QString path = picture("look.bmp", halves(1000, 500, Qt::red, Qt::blue));
+    look.showPicture(path);
+    // Red lies left, on top, right, below: a quarter turn clockwise each time, and upright again after four.
+    struct Case {
+        int angle;
+        PictureSize box;
+        double redX, redY;
+    };
+    for (const Case& c :
+         {Case{0, {700, 350}, 0.1, 0.5}, Case{90, {350, 700}, 0.5, 0.1}, Case{180, {700, 350}, 0.9, 0.5},
+          Case{270, {350, 700}, 0.5, 0.9}, Case{0, {700, 350}, 0.1, 0.5}}) {
+        EXPECT_EQ(look.angle, c.angle);
+        EXPECT_EQ(look.Picture2Box, c.box);
+        const QImage& shown = look.Picture2.image();
+        EXPECT_EQ(shown.width() * c.box.height, shown.height() * c.box.width);
+        EXPECT_EQ(shown.pixelColor(static_cast<int>(shown.width() * c.redX), static_cast<int>(shown.height() * c.redY)),
+                  QColor(Qt::red))
+            << c.angle;
+        look.Command1_Click();
+    }
+    std::filesystem::remove(*machine.drives.toHost(path));
+    look.Command2_Click();
+    EXPECT_TRUE(look.Picture2.isNull());
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages.first().contains(QStringLiteral("look.bmp")));
+    look.Command3_Click();
+    EXPECT_EQ(chain.find(PageId::Form3), nullptr);
+}
+
+} // namespace
+} // namespace lumora
