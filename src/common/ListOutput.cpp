@@ -1,6 +1,7 @@
 #include "common/ListOutput.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/FixedText.h"
 
 #include <utility>
 
@@ -35,6 +36,12 @@ ListOutput& ListOutput::date(const std::optional<QDateTime>& value) {
     else if (zeroDate)
         form = QStringLiteral("hh:mm:ss");
     m_bytes.append('#').append(when.toString(form).toLatin1()).append('#');
+    return *this;
+}
+
+ListOutput& ListOutput::single(float value) {
+    separate();
+    m_bytes.append(PlainNumber(value).toLatin1());
     return *this;
 }
 

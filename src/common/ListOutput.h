@@ -7,14 +7,16 @@
 
 #include <optional>
 
-// The list-output form of the stored texts: items of a line separated by a comma, a text in double quotes (also when it is empty;
-// a quote inside stays bare), numbers bare, CR LF behind each line, the ANSI code page. docs/formats.md has the table.
+// The list-output form of the stored texts: items of a line separated by a comma, a text in double quotes (also when it
+// is empty; a quote inside stays bare), numbers bare, CR LF behind each line, the ANSI code page. docs/formats.md has
+// the table.
 namespace lumora {
 
 class ListOutput {
 public:
     ListOutput& text(const QString& value);
     ListOutput& number(long long value);
+    ListOutput& single(float value);
 
     // #yyyy-mm-dd hh:mm:ss#; at midnight the date alone; the zero date of the format, 1899-12-30, when there is none.
     ListOutput& date(const std::optional<QDateTime>& value);
@@ -39,11 +41,12 @@ struct ListOutputEntry {
     QString value;
 };
 
-// The lines of a stored text, in order, without their CR LF or LF. A break inside an open quoted item does not end the line.
+// The lines of a stored text, in order, without their CR LF or LF. A break inside an open quoted item does not end the
+// line.
 QStringList ListOutputLines(const QByteArray& bytes);
 
-// The entries of all lines that begin with a quoted key. The key runs up to the first `",`, so that quotes and commas in a value,
-// which the format leaves bare, do no harm. Lines without a key are passed over.
+// The entries of all lines that begin with a quoted key. The key runs up to the first `",`, so that quotes and commas
+// in a value, which the format leaves bare, do no harm. Lines without a key are passed over.
 QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes);
 
 // A line without its first and its last character: how the detail stores take a quoted text back.

@@ -1,0 +1,188 @@
+// The routines around frames and channels that no page calls.
+#include "editing/ChannelMinimums.h"
+#include "editing/FrameScramble.h"
+#include "editing/LineFrame.h"
+#include "imaging/Bitmap.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <QPainter>
+
+namespace lumora {
+namespace {
+
+class FrameRoutines : public ::testing::Test {
+protected:
+    FrameRoutines() {
+        state.DiskRoot = machine.drives.programRoot();
+        EXPECT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora")).ok());
+    }
+    QByteArray read(const QString& path) {
+        const auto bytes = machine.files.read(path);
+        return bytes ? *bytes : QByteArray("unreadable");
+    }
+    void write(const QString& path, const QByteArray& bytes) {
+        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok());
+    }
+    QStringList names(const QString& folder) { return machine.files.names(folder, QStringLiteral("*.*")); }
+
+    TestPlatform machine;
+    SessionState state;
+    const QString frame = QStringLiteral("C:\\frame.bmp");
+    const QString results = QStringLiteral("C:\\2000lumora\\!!moozpanim");
+    const QString pieces = QStringLiteral("C:\\2000lumora\\!!benaime");
+    const QString packed = results + QStringLiteral("\\!k.bmp");
+};
+
+const ChannelMinimums minimums{{1, 2.5F, 0.001F}, {-4, 0, 255}, {0.4F, 100000, 33.25F}};
+
+TEST_F(FrameRoutines, ChannelMinimumsAreWrittenGreenBlueRed) {
+    ASSERT_TRUE(minimums.writeTo(machine.files, frame).ok());
+    EXPECT_EQ(read(frame),
+              QByteArray("\"00\",\"00\"\r\n"
+                         "\"TKN.A_G_MIN(1)\",-4\r\n\"TKN.A_G_MIN(2)\",0\r\n\"TKN.A_G_MIN(3)\",255\r\n"
+                         "\"TKN.A_B_MIN(1)\",0.4\r\n\"TKN.A_B_MIN(2)\",100000\r\n\"TKN.A_B_MIN(3)\",33.25\r\n"
+                         "\"TKN.A_R_MIN(1)\",1\r\n\"TKN.A_R_MIN(2)\",2.5\r\n\"TKN.A_R_MIN(3)\",0.001\r\n"));
+}
+
+TEST_F(FrameRoutines, ChannelMinimumsReadTheSameInAnyOrder) {
+    ASSERT_TRUE(minimums.writeTo(machine.files, frame).ok());
+    QList<QByteArray> lines = read(frame).trimmed().split('\n');
+    std::reverse(lines.begin(), lines.end());
+    write(frame, lines.join('\n'));
+    ChannelMinimums found;
+    ASSERT_TRUE(found.readFrom(machine.files, frame).ok());
+    EXPECT_EQ(found, minimums);
+}
+
+TEST_F(FrameRoutines, ChannelMinimumsKeepWhatAFileDoesNotSay) {
+    ChannelMinimums found = minimums;
+    ASSERT_TRUE(found.readFrom(machine.files, QStringLiteral("C:\\none.txt")).ok());
+    EXPECT_EQ(found, minimums);
+    write(frame, "\"TKN.A_R_MIN(2)\",\"7.5 or so\"\r\n\"TKN.A_X_MIN(1)\",9\r\nno key\r\n\"TKN.A_R_MIN(4)\",9\r\n");
+    ASSERT_TRUE(found.readFrom(machine.files, frame).ok());
+    ChannelMinimums expected = minimums;
+    expected.A_R_MIN[1] = 7.5F;
+    EXPECT_EQ(found, expected);
+}
+
+TEST_F(FrameRoutines, ScramblingExchangesTheFirstTwoBlocksAndUndoesItself) {
+    QByteArray bytes;
+    for (int i = 0; i < 100'000; ++i)
+        bytes.append(static_cast<char>(i * 7 + i / 251));
+    write(frame, bytes);
+    const auto once = ScrambleFrameFile(state, machine.files, frame);
+    ASSERT_TRUE(once.ok());
+    EXPECT_EQ(*once, packed);
+    EXPECT_EQ(read(packed), bytes.mid(23000, 23000) + bytes.first(23000) + bytes.mid(46000));
+    EXPECT_EQ(read(frame), bytes);
+    EXPECT_EQ(names(pieces), QStringList());
+    ASSERT_TRUE(ScrambleFrameFile(state, machine.files, packed).ok());
+    EXPECT_EQ(read(packed), bytes);
+}
+
+TEST_F(FrameRoutines, ScramblingLeavesSmallFilesAloneAndClearsWhatAnInterruptedRunLeft) {
+    write(frame, QByteArray(99'999, 'a'));
+    const auto small = ScrambleFrameFile(state, machine.files, frame);
+    ASSERT_TRUE(small.ok());
+    EXPECT_EQ(*small, QString());
+    EXPECT_FALSE(machine.files.folderExists(results));
+
+    ASSERT_TRUE(machine.files.makeFolder(pieces).ok());
+    write(pieces + QStringLiteral("\\kzz.bmp"), "half a join");
+    write(frame, QByteArray(100'000, 'a'));
+    ASSERT_TRUE(ScrambleFrameFile(state, machine.files, frame).ok());
+    EXPECT_EQ(read(packed), QByteArray(100'000, 'a'));
+    EXPECT_EQ(names(pieces), QStringList());
+}
+
+TEST_F(FrameRoutines, AScramblingThatFailsLosesNothing) {
+    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, QStringLiteral("C:\\none.bmp")).ok());
+    write(frame, QByteArray(120'000, 'a'));
+    // A file stands where the folder should be.
+    write(results, "in the way");
+    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, frame).ok());
+    EXPECT_EQ(read(frame), QByteArray(120'000, 'a'));
+    EXPECT_EQ(read(results), QByteArray("in the way"));
+}
+
+// How much of the line's colour is in a pixel of a black box, 0 to 250.
+int ink(const QImage& image, int x, int y) {
+    return image.pixelColor(x, y).red();
+}
+
+QImage lineFrame(const QString& code, int width = 450, int height = 300) {
+    Bitmap box(width, height, Qt::black);
+    PaintLineFrame(box, code);
+    return box.image();
+}
+
+TEST(PaintLineFrame, PutsTheInkOfEachStyleWhereItsTableSays) {
+    struct Case {
+        const char* code;
+        int x, y;
+        int ink; // of 250
+    };
+    constexpr double whole = 250;
+    const auto blended = [](int alpha) { return static_cast<int>(whole * alpha / 255); };
+    for (const Case& c : {
+             // Thin rectangles, one a pixel, from 255 down by 2 or 3 a step.
+             Case{"W03", 0, 150, 250},
+             Case{"W03", 10, 150, blended(235)},
+             Case{"W03", 100, 150, blended(55)},
+             Case{"W03", 140, 150, 0},
+             Case{"W13", 10, 150, blended(225)},
+             Case{"W13", 90, 150, 0},
+             Case{"W17", 22, 150, blended(205 - 66)},
+             Case{"W17", 23, 150, 0},
+             // The ellipse that touches the edges, growing outwards: the middle of an edge, and nothing inside.
+             Case{"W04", 225, 30, 0},
+             Case{"W14", 225, 150, 0},
+             Case{"W16", 225, 150, 0},
+             // An edge whose pen lies half outside.
+             Case{"W21", 9, 150, blended(211)},
+             Case{"W21", 11, 150, 0},
+             Case{"W22", 9, 150, blended(155)},
+             Case{"W29", 29, 150, blended(211)},
+             Case{"W29", 31, 150, 0},
+             // A second line of 12 around half the first width.
+             Case{"W31", 15, 150, blended(200)},
+             Case{"W31", 17, 150, 0},
+             // The innermost line of the glow.
+             Case{"W41", 20, 150, blended(183)},
+             Case{"W41", 22, 150, 0},
+             // Styles without a shape.
+             Case{"W00", 0, 0, 0},
+             Case{"W07", 0, 150, 0},
+             Case{"W20", 0, 150, 0},
+             Case{"W51", 0, 150, 0},
+             Case{"X21", 0, 150, 0},
+             Case{"000", 0, 150, 0},
+         })
+        EXPECT_NEAR(ink(lineFrame(QString::fromLatin1(c.code)), c.x, c.y), c.ink, 2)
+            << c.code << " at " << c.x << ", " << c.y;
+}
+
+TEST(PaintLineFrame, DrawsTheStylesOfTheTableAndNoOthersOnABoxOfAnySize) {
+    for (const QSize size : {QSize(300, 450), QSize(7, 3), QSize(1, 1)}) {
+        for (int style = 1; style <= 60; ++style) {
+            const bool drawn = style <= 6 || (style >= 13 && style <= 19) || (style >= 21 && style <= 50);
+            const QImage image =
+                lineFrame(QStringLiteral("W%1").arg(style, 2, 10, QLatin1Char('0')), size.width(), size.height());
+            const QImage plain = Bitmap(size.width(), size.height(), Qt::black).image();
+            if (!drawn || size.width() == 300) {
+                EXPECT_EQ(image != plain, drawn) << style;
+            }
+        }
+    }
+}
+
+TEST(PaintLineFrame, TakesTheColourOfItsLetter) {
+    EXPECT_EQ(lineFrame(QStringLiteral("S03")).pixelColor(0, 150), QColor(240, 120, 0));
+    EXPECT_EQ(lineFrame(QStringLiteral("T03")).pixelColor(0, 150), QColor(0, 250, 250));
+}
+
+} // namespace
+} // namespace lumora
