@@ -136,7 +136,7 @@ QPushButton[role="tall"] { min-height: @52px; padding: 0 @8px; font-size: @15px;
 QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }
 QPushButton[role="done"] { border: none; background: $Primary; color: white; padding: 0 @26px; }
 QPushButton[role="done"]:hover, QPushButton[role="done"]:pressed { background: $PrimaryDark; }
-QPushButton[role="key"], QPushButton[role="wordKey"] { padding: 0; min-width: %keypx; min-height: %keypx;
+QPushButton[role="key"], QPushButton[role="wordKey"] { padding: 0; min-width: @32px; min-height: %keypx;
   border: 1px solid $Line; border-bottom: 2px solid $Edge; border-radius: @10px; font-size: @22px; font-weight: normal; }
 QPushButton[role="wordKey"] { font-size: @16px; font-weight: bold; }
 QPushButton[role="key"]:pressed, QPushButton[role="wordKey"]:pressed { background: $PrimarySoft; border-color: $Primary; }
