@@ -1,3 +1,5 @@
+#include "Portrait.h"
+
 #include "support/SamplePhotographs.h"
 
 #include <cstdio>
@@ -6,8 +8,15 @@
 
 using namespace lumora;
 
+namespace {
+
+// Of one size, so that a scenario finds the red eyes at the same pixels.
+constexpr int portraitWidth = 1500;
+
+} // namespace
+
 // Fills a folder with generated photographs for the demo and the tests. The last one has a Hebrew name, as customers'
-// files do.
+// files do; the one before it is a face with red eyes.
 int main(int argc, char** argv) {
     const int count = argc > 2 ? std::atoi(argv[2]) : 12;
     const double megapixels = argc > 3 ? std::atof(argv[3]) : 12;
@@ -22,6 +31,13 @@ int main(int argc, char** argv) {
         if (!written) {
             std::fprintf(stderr, "%s\n", qUtf8Printable(written.failure().message));
             return 1;
+        }
+        if (count > 1) {
+            const auto saved = saveJpeg(demo::portrait(portraitWidth), written->rbegin()[1], 92);
+            if (!saved) {
+                std::fprintf(stderr, "%s\n", qUtf8Printable(saved.failure().message));
+                return 1;
+            }
         }
         std::filesystem::rename(written->back(), folder / u8"סבתא בחוף.jpg");
     } catch (const std::exception& failure) {
