@@ -158,7 +158,7 @@ bool tFrmNew::loadPictureOfRecord() {
 bool tFrmNew::LoadWorkBitmap(const QString& path) {
     const PaperDigits paper = *PaperDigits::parse(PaperSizeCode);
     Result<EditedPreview> opened =
-        EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, m_scale);
+        EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
         tell(QStringLiteral("לא ניתן לפתוח את התמונה לעריכה"),
              QStringLiteral("The picture can't be opened for editing"), opened.failure().message);
@@ -341,7 +341,7 @@ void tFrmNew::Command23_Click() {
 }
 
 void tFrmNew::setPreviewScale(double scale) {
-    const double held = std::clamp(scale, 1.0, 2.0);
+    const double held = std::clamp(scale, 1.0, largestScale);
     if (held == m_scale)
         return;
     m_scale = held;

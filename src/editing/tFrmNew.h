@@ -46,8 +46,9 @@ public:
 
     // --- events ---
 
-    // How many real pixels a logical pixel of the paper has on this screen, 1 to 2. Best told before a picture is
-    // opened: no more pixels are read of it than the scale asks for.
+    // How many real pixels a logical pixel of the paper has on this screen, held within 1 to 2: a tick stays a twelfth
+    // of its time then.
+    static constexpr double largestScale = 2;
     void setPreviewScale(double scale);
 
     // Pressed by other pages.
