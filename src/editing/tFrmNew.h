@@ -212,6 +212,7 @@ Q_SIGNALS:
 
 private:
     enum class Tone { Grey, Sepia, Blue, Green };
+    enum class Release { MouseUp, Lost };
 
     EditFields& edit() const;
     BigPics& surfaces() const;
@@ -238,8 +239,8 @@ private:
 
     void hold(Ticker& ticker, int step);
     void dropHold();
-    void endHold();
-    void zoomReleased();
+    void endHold(Release release = Release::MouseUp);
+    void zoomReleased(Release release);
     void panBy(QPointF distance);
     void setTurn(std::int16_t code);
     void setGains(float red, float green, float blue);

@@ -48,21 +48,21 @@ void tFrmNew::dropHold() {
     m_cropHandle.release();
 }
 
-void tFrmNew::endHold() {
+void tFrmNew::endHold(Release release) {
     const Ticker* held = m_held;
     if (m_held != nullptr)
         m_held->stop();
     m_held = nullptr;
     sunkImage2 = -1;
     if (held == &Timer2)
-        zoomReleased();
+        zoomReleased(release);
     else if (held == &Timer3)
         StoreCurrentEdit();
     Q_EMIT changed();
 }
 
 void tFrmNew::stopHolds() {
-    endHold();
+    endHold(Release::Lost);
     if (m_labelHandle.held())
         Labeltext_MouseUp();
     if (Image3.held())
@@ -90,6 +90,8 @@ void tFrmNew::Image2_MouseDown(int index) {
         hold(Timer2, index == zoomIn ? zoomStep : -zoomStep);
     else if (index == darker || index == lighter)
         hold(Timer3, index == lighter ? brightnessStep : -brightnessStep);
+    else
+        return;
     if (m_held != nullptr)
         sunkImage2 = index;
 }
@@ -113,9 +115,10 @@ void tFrmNew::Timer2_Tick() {
     showNumbers();
 }
 
-void tFrmNew::zoomReleased() {
+void tFrmNew::zoomReleased(Release release) {
     const unsigned opening = m_openings;
-    m_platform.pump.pump();
+    if (release == Release::MouseUp)
+        m_platform.pump.pump();
     if (!m_open || opening != m_openings)
         return; // another picture was opened meanwhile
     edit().ZoomPercent = PreviewZoom;
