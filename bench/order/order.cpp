@@ -1,8 +1,14 @@
-// A whole order through the preparation page, beside the sum of what its pictures take to scale one after another on
-// one thread, in the same run; and the memory that an order of many pictures takes.
+// A whole order through its preparation page, beside the sum of what its pictures take to scale, or those of an edited
+// order to render, one after another on one thread, in the same run; and the memory that an order of many pictures
+// takes.
 
+#include "assembly/B3.h"
 #include "assembly/Form2.h"
 #include "assembly/PaperResize.h"
+#include "editing/EditRecord.h"
+#include "editing/EditedPicture.h"
+#include "editing/gdisave.h"
+#include "imaging/BmpFile.h"
 #include "platform/QtEventPump.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -57,15 +63,53 @@ double memory(const char* field) {
     return -1;
 }
 
+enum class Kind { Plain, Edited };
+
+// What a customer may have done to picture i: two of three are only moved, zoomed, turned or made brighter; of every
+// third in turn a tone, a frame, a caption and a corrected copy.
+QString recordOf(int i) {
+    QString text = EditRecord::newPicture();
+    const auto set = [&text](EditRecord::Column column, const char* value) {
+        text.replace(column.position - 1, column.width,
+                     QString::fromLatin1(value).leftJustified(column.width, u' ', true));
+    };
+    set(EditRecord::PanX, "225");
+    set(EditRecord::PanY, "150");
+    if (i % 3 == 1) {
+        set(EditRecord::ZoomPercent, "130");
+        set(EditRecord::GainR, "1.12");
+    } else if (i % 3 == 2) {
+        set(EditRecord::RotationCode, "186");
+        set(EditRecord::ZoomPercent, "110");
+    } else if (i % 12 == 0) {
+        set(EditRecord::ToneFlag, "1");
+        set(EditRecord::GainB, "0.7");
+    } else if (i % 12 == 3) {
+        set(EditRecord::FrameName, "001");
+        set(EditRecord::FrameFolder, "bench");
+    } else if (i % 12 == 6) {
+        set(EditRecord::TextOn, "1");
+        set(EditRecord::TextFontSize, "30");
+        set(EditRecord::TextX, "60");
+        set(EditRecord::TextY, "200");
+        set(EditRecord::TextRed, "255");
+        set(EditRecord::TextFont, "DejaVu Sans");
+        set(EditRecord::TextBody, "Summer 2026");
+    } else {
+        set(EditRecord::RedMarker, "RED");
+    }
+    return text;
+}
+
 class Bench {
 public:
-    Bench()
-        : m_platform{m_machine.files, m_machine.dialogs, m_machine.noInternet, m_machine.shell, m_machine.clock,
+    explicit Bench(Kind kind)
+        : m_kind(kind)
+        , m_platform{m_machine.files, m_machine.dialogs, m_machine.noInternet, m_machine.shell, m_machine.clock,
                      m_pump,          m_machine.volume}
         , m_chain(m_pump) {
-        std::filesystem::create_directories(*m_machine.drives.toHost(QStringLiteral("C:\\vedron")));
-        const HostPath folder = *m_machine.drives.toHost(QStringLiteral("C:\\pics"));
-        std::filesystem::create_directories(folder);
+        const HostPath folder = makeFolder("C:\\pics");
+        makeFolder("C:\\vedron");
         auto written = writeSamplePhotographs(folder, distinctPictures, megapixels);
         if (!written) {
             std::fprintf(stderr, "%s\n", qPrintable(written.failure().message));
@@ -73,7 +117,7 @@ public:
         }
         m_pictures = *written;
         m_state.DiskRoot = m_machine.drives.programRoot();
-        m_state.Optint = 1;
+        m_state.Optint = kind == Kind::Plain ? 1 : 2;
         m_state.profile.JppBase = 30;
         m_state.profile.JppChunks = 56;
         m_state.shemot.ppr = QStringLiteral("10/15");
@@ -82,18 +126,30 @@ public:
         for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
             m_chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });
         m_chain.registerPage(PageId::Form2, [this] { return std::make_unique<Form2>(m_state, m_platform, m_chain); });
+        m_chain.registerPage(PageId::B3, [this] { return std::make_unique<B3>(m_state, m_platform, m_chain); });
+        m_chain.registerPage(PageId::gdisave,
+                             [this] { return std::make_unique<gdisave>(m_state, m_platform, m_chain); });
+        if (kind == Kind::Edited)
+            makeEdits();
     }
 
     // The order of so many pictures; at(page) at each sign of progress.
-    Times order(int pictures, const std::function<void(const Form2&)>& at = {}) {
+    Times order(int pictures, const std::function<void(const PreparationPage&)>& at = {}) {
         m_state.MisparHazmana = QString::number(++m_number);
         for (int i = 0; i < pictures; ++i)
-            m_state.handOver.lines += QStringLiteral("1 1015GNB") + m_machine.drives.toDrive(source(i));
-        m_chain.show(PageId::Form2);
-        auto* page = dynamic_cast<Form2*>(m_chain.find(PageId::Form2));
+            m_state.handOver.lines +=
+                QStringLiteral("1 1015GNB") + (m_kind == Kind::Edited ? recordOf(i) : QString()) + drivePath(i);
+        const PageId id = m_kind == Kind::Plain ? PageId::Form2 : PageId::B3;
+        m_chain.show(id);
+        auto* page = dynamic_cast<PreparationPage*>(m_chain.find(id));
         if (at)
             QObject::connect(page, &Page::changed, page, [page, at] { at(*page); });
-        const Times times = timed([page] { page->Command3_Click(); });
+        const Times times = timed([page] {
+            if (auto* plain = dynamic_cast<Form2*>(page))
+                plain->Command3_Click();
+            else if (auto* edited = dynamic_cast<B3*>(page))
+                edited->Command5_Click();
+        });
         const auto made = m_machine.files.names(m_state.transfer.OrderFolder, QStringLiteral("*.jpp")).size() - 1;
         if (made != pictures || m_chain.front()->id() != PageId::FtpFrm) {
             std::fprintf(stderr, "the order is not whole: %lld of %d prints\n%s\n", static_cast<long long>(made),
@@ -105,10 +161,11 @@ public:
         return times;
     }
 
-    Times scalingAlone(int pictures) const {
+    // The pictures alone, one after another.
+    Times alone(int pictures) const {
         return timed([this, pictures] {
             for (int i = 0; i < pictures; ++i) {
-                if (!resizeToPaper(source(i), {10, 15}))
+                if (!(m_kind == Kind::Plain ? resizeToPaper(source(i), {10, 15}) : rendered(i)))
                     std::exit(1);
             }
         });
@@ -116,7 +173,46 @@ public:
 
 private:
     const HostPath& source(int i) const { return m_pictures[static_cast<std::size_t>(i) % m_pictures.size()]; }
+    QString drivePath(int i) const { return m_machine.drives.toDrive(source(i)); }
 
+    HostPath makeFolder(const char* path) {
+        const HostPath folder = *m_machine.drives.toHost(QString::fromLatin1(path));
+        std::filesystem::create_directories(folder);
+        return folder;
+    }
+
+    // A frame, and the corrected copies of the pictures that are marked.
+    void makeEdits() {
+        makeFolder("C:\\2000lumora\\zmany\\tempred");
+        Bitmap frame(1500, 1000, Qt::black);
+        QImage& image = frame.image();
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (x < 60 || y < 60 || x >= image.width() - 60 || y >= image.height() - 60)
+                    image.setPixel(x, y, qRgb(220, 200, 120));
+            }
+        }
+        bool made = saveBmp(frame, makeFolder("C:\\2000lumora\\misgarot\\bench") / "001.bmp").ok();
+        for (int i = 9; i < distinctPictures; i += 12) {
+            const auto picture = loadPicture(source(i));
+            made = made && picture && saveBmp(*picture, corrected(i)).ok();
+        }
+        if (!made)
+            std::exit(1);
+    }
+    HostPath corrected(int i) const { return *m_machine.drives.toHost(EditedPaths::corrected(m_state, drivePath(i))); }
+
+    Result<QByteArray> rendered(int i) const {
+        EditFields edit;
+        UnpackEditState(recordOf(i), edit);
+        EditedPrint print;
+        print.file = edit.RedMarker == QStringLiteral("RED") ? corrected(i) : source(i);
+        print.paper = {10, 15};
+        print.framesFolder = *m_machine.drives.toHost(QStringLiteral("C:\\2000lumora\\misgarot"));
+        return renderEditedPrintToJpeg(print, edit);
+    }
+
+    const Kind m_kind;
     TestPlatform m_machine;
     QtEventPump m_pump;
     Platform m_platform;
@@ -131,8 +227,9 @@ double median(std::vector<double> values) {
     return values[values.size() / 2];
 }
 
-int ratio(int pictures, int rounds) {
-    Bench bench;
+int ratio(Kind kind, int pictures, int rounds) {
+    const char* work = kind == Kind::Plain ? "scaling" : "rendering";
+    Bench bench(kind);
     bench.order(distinctPictures); // warm
     std::vector<double> ratios;
     for (int round = 0; round < rounds; ++round) {
@@ -140,22 +237,22 @@ int ratio(int pictures, int rounds) {
         Times alone;
         Times order;
         if (round % 2 == 0)
-            alone = bench.scalingAlone(pictures);
+            alone = bench.alone(pictures);
         order = bench.order(pictures);
         if (round % 2 != 0)
-            alone = bench.scalingAlone(pictures);
+            alone = bench.alone(pictures);
         ratios.push_back(order.wall / alone.wall);
         std::printf(
-            "%d pictures: scaling alone %.0f ms (processor %.0f), whole order %.0f ms (processor %.0f), ratio %.2f\n",
-            pictures, alone.wall, alone.processor, order.wall, order.processor, ratios.back());
+            "%d pictures: %s alone %.0f ms (processor %.0f), whole order %.0f ms (processor %.0f), ratio %.2f\n",
+            pictures, work, alone.wall, alone.processor, order.wall, order.processor, ratios.back());
         std::fflush(stdout);
     }
     std::printf("median ratio %.2f\n", median(ratios));
     return 0;
 }
 
-int peakMemory(int pictures) {
-    Bench bench;
+int peakMemory(Kind kind, int pictures) {
+    Bench bench(kind);
     std::printf("before the order %.0f MiB (most so far, with the making of the pictures: %.0f)\n", memory("VmRSS:"),
                 memory("VmHWM:"));
     // The most so far starts anew.
@@ -164,7 +261,7 @@ int peakMemory(int pictures) {
         std::printf("the mark of the most could not be reset\n");
     clear.close();
     int last = 0;
-    const Times times = bench.order(pictures, [&](const Form2& page) {
+    const Times times = bench.order(pictures, [&](const PreparationPage& page) {
         const int at = page.Label17.text.toInt();
         if (at != last && at > 0 && at % std::max(1, pictures / 6) == 0)
             std::printf("picture %3d: %.0f MiB, most %.0f\n", at, memory("VmRSS:"), memory("VmHWM:"));
@@ -179,12 +276,13 @@ int peakMemory(int pictures) {
 
 int main(int argc, char** argv) {
     QGuiApplication application(argc, argv);
-    const QStringList arguments = QCoreApplication::arguments();
+    QStringList arguments = QCoreApplication::arguments();
+    const Kind kind = arguments.removeAll(QStringLiteral("edited")) > 0 ? Kind::Edited : Kind::Plain;
     if (arguments.value(1) == QLatin1String("ratio"))
-        return ratio(arguments.value(2, QStringLiteral("100")).toInt(),
+        return ratio(kind, arguments.value(2, QStringLiteral("100")).toInt(),
                      arguments.value(3, QStringLiteral("3")).toInt());
     if (arguments.value(1) == QLatin1String("memory"))
-        return peakMemory(arguments.value(2, QStringLiteral("300")).toInt());
-    std::fprintf(stderr, "bench_order ratio [PICTURES] [ROUNDS] | bench_order memory [PICTURES]\n");
+        return peakMemory(kind, arguments.value(2, QStringLiteral("300")).toInt());
+    std::fprintf(stderr, "bench_order ratio|memory [PICTURES] [ROUNDS] [edited]\n");
     return 2;
 }

@@ -1,5 +1,6 @@
 #include "app/PageRegister.h"
 
+#include "assembly/B3.h"
 #include "assembly/Form2.h"
 #include "editing/BigPics.h"
 #include "editing/Form3.h"
@@ -14,6 +15,7 @@
 #include "session/hatchala.h"
 #include "transfer/FtpFrm.h"
 #include "transfer/InetForm.h"
+#include "views/B3View.h"
 #include "views/Form2View.h"
 #include "views/Form3View.h"
 #include "views/FtpFrmView.h"
@@ -37,6 +39,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::Form3, [&] { return std::make_unique<Form3>(state, platform, chain); });
     chain.registerPage(PageId::RedI, [&] { return std::make_unique<RedI>(state, platform, chain); });
     chain.registerPage(PageId::mikledet, [&] { return std::make_unique<mikledet>(state, platform, chain); });
+    chain.registerPage(PageId::B3, [&] { return std::make_unique<B3>(state, platform, chain); });
     chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
     chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
@@ -58,6 +61,9 @@ void registerViews(MainWindow& window, SessionState& state, const Files& files) 
     });
     window.registerView(PageId::mikledet, [&](Page& page, const Theme& theme) {
         return std::make_unique<mikledetView>(static_cast<mikledet&>(page), state, theme);
+    });
+    window.registerView(PageId::B3, [&](Page& page, const Theme& theme) {
+        return std::make_unique<B3View>(static_cast<B3&>(page), state, theme);
     });
     window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
         return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);

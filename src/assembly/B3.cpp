@@ -39,8 +39,8 @@ B3::~B3() = default;
 
 void B3::load() {
     takeLines();
-    const QString& ppr = m_state.shemot.ppr;
-    m_paper = PaperDigits::parse(ppr.left(2) + ppr.right(2));
+    fillList2();
+    m_paper = PaperDigits::ofPaper(m_state.shemot.ppr);
     m_jobFolder = WorkspacePaths::jobFolder(m_state);
     Command1.visible = false;
     Picture5.visible = false;
@@ -103,8 +103,11 @@ void B3::Command7_Click() {
 bool B3::prepareOrder() {
     List4fail.clear();
     m_writeFailures = 0;
-    if (!m_platform.files.folderExists(m_jobFolder))
-        static_cast<void>(m_platform.files.makeFolder(m_jobFolder)); // without it the sheet has no pictures
+    // Without the folder the sheet has no pictures, and that is all: the order goes on.
+    for (const QString& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
+        if (!m_platform.files.folderExists(path))
+            static_cast<void>(m_platform.files.makeFolder(path));
+    }
     if (!somethingChosen())
         return false;
     m_state.transfer.MailFlag = 0;
@@ -114,9 +117,7 @@ bool B3::prepareOrder() {
     if (!openFolder(folder))
         return false;
 
-    List2.clear();
-    for (const QString& item : List1.items())
-        List2.append(LeafName(item));
+    fillList2();
     List1.setCurrentIndex(0);
     PrintPacker packer(m_state, m_platform.files, folder, OrderTail::shortWidth);
     {
@@ -131,6 +132,12 @@ bool B3::prepareOrder() {
         return false;
     setStage(Stage::Closing);
     return writeLog(folder, editedOrderLog(m_state, List1.items(), List4fail.items(), m_platform.clock.now()));
+}
+
+void B3::fillList2() {
+    List2.clear();
+    for (const QString& item : List1.items())
+        List2.append(LeafName(item));
 }
 
 void B3::PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints) {
@@ -186,8 +193,7 @@ void B3::saveThumbnail(const OrderItem& item, const QString& scratch) {
     Q_EMIT changed();
     NewContent thumbnail(*target, path);
     appendBmp(Picture3, thumbnail, [] { return false; });
-    if (const Result<void> saved = thumbnail.commit(NewContent::Durability::Passing); !saved)
-        tellWriteFailure(saved.failure());
+    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
 }
 
 bool B3::BuildOrderSheet() {

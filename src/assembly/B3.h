@@ -39,6 +39,7 @@ public:
 
 private:
     void setPreparing(bool on) override;
+    void fillList2();
     bool prepareOrder();
     void PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints);
     Result<QByteArray> RenderEditedPicture(const OrderItem& item, EditedPrints& prints);

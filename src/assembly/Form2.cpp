@@ -39,7 +39,7 @@ class Form2::Prints {
 public:
     Prints(const SessionState& state, const Files& files, const QStringList& items)
         : m_files(files)
-        , m_paper(PaperSize::parse(state.shemot.ppr))
+        , m_paper(PaperDigits::ofPaper(state.shemot.ppr))
         , m_sources(state.DchisaAmoka == 1 ? QStringList() : sourcesToScale(items))
         , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
 
@@ -72,7 +72,7 @@ private:
     }
 
     const Files& m_files;
-    const std::optional<PaperSize> m_paper;
+    const std::optional<PaperDigits> m_paper;
     const QStringList m_sources;
     Ahead m_prints;
 };

@@ -7,14 +7,7 @@
 
 namespace lumora {
 
-std::optional<PaperSize> PaperSize::parse(const QString& text) {
-    const PaperSize paper{Val16(text.left(2)), Val16(text.right(2))};
-    if (paper.shortSide <= 0 || paper.longSide <= 0)
-        return std::nullopt;
-    return paper;
-}
-
-PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
+PictureSize paperPictureSize(PictureSize source, PaperDigits paper) {
     const double ratio = static_cast<double>(source.height) / std::max(source.width, 1);
     const int width = (ratio >= 1 ? paper.shortSide : paper.longSide) * pixelsPerCentimetre;
     // The product first: it is exact, so that a height of one half is seen as one.
@@ -25,7 +18,7 @@ PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
     return {width, static_cast<int>(rounded)};
 }
 
-Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper) {
+Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperDigits paper) {
     const Result<PictureSize> size = readPictureSize(source);
     if (!size)
         return size.failure();

@@ -1,27 +1,15 @@
 #pragma once
 
 #include "common/Result.h"
+#include "editing/PicturePlacement.h"
 #include "imaging/PictureFile.h"
 
 #include <QByteArray>
-#include <QString>
 
 #include <filesystem>
-#include <optional>
 
 // How large a plain print is, and the print itself.
 namespace lumora {
-
-// A paper in whole centimetres, as the order names it: "10/15".
-struct PaperSize {
-    int shortSide = 0;
-    int longSide = 0;
-
-    // The first two characters and the last two of the text. No value when one of them is no positive number: the
-    // marker of a mixed order, a size not chosen yet.
-    static std::optional<PaperSize> parse(const QString& text);
-    bool operator==(const PaperSize&) const = default;
-};
 
 inline constexpr int pixelsPerCentimetre = 120; // about 300 dots an inch
 inline constexpr int printQuality = 90;
@@ -29,10 +17,10 @@ inline constexpr int printQuality = 90;
 // A portrait or square picture takes the paper's short side as its width, a landscape picture the long side; the height
 // follows the picture, in double precision, ties to even. What would be enlarged keeps its own size, and nothing is
 // ever cut off. The height is 0 for a picture so flat that nothing of it is left.
-PictureSize paperPictureSize(PictureSize source, PaperSize paper);
+PictureSize paperPictureSize(PictureSize source, PaperDigits paper);
 
 // The picture scaled to the paper, as the bytes of a JPEG. Touches nothing but the source file, so that it may run
 // beside the thread that packs the picture before. A picture of no height is a failure.
-Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper);
+Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperDigits paper);
 
 } // namespace lumora

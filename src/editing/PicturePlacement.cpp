@@ -29,10 +29,14 @@ PaperOrientation orientationOf(PictureSize picture) {
 }
 
 std::optional<PaperDigits> PaperDigits::parse(const QString& code) {
-    const PaperDigits paper{Val16(code.left(2)), Val16(code.mid(2, 2))};
-    if (code.size() != 4 || paper.shortSide < 1 || paper.longSide < 1)
+    return code.size() == 4 ? ofPaper(code) : std::nullopt;
+}
+
+std::optional<PaperDigits> PaperDigits::ofPaper(const QString& paper) {
+    const PaperDigits digits{Val16(paper.left(2)), Val16(paper.right(2))};
+    if (digits.shortSide < 1 || digits.longSide < 1)
         return std::nullopt;
-    return paper;
+    return digits;
 }
 
 PictureSize previewBox(PaperDigits paper, PaperOrientation orientation) {

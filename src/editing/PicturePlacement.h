@@ -20,12 +20,16 @@ enum class PaperOrientation { Landscape, Portrait };
 // A square picture counts as portrait.
 PaperOrientation orientationOf(PictureSize picture);
 
-// The two numbers of a four-digit paper code, "1015": short side and long side in centimetres.
+// A paper in whole centimetres.
 struct PaperDigits {
     int shortSide = 0;
     int longSide = 0;
-    // No value for a text without two usable numbers, as "zz/zz" gives.
+    bool operator==(const PaperDigits&) const = default;
+
+    // From a four-digit paper code, "1015". No value for a text without two usable numbers, as "zz/zz" gives.
     static std::optional<PaperDigits> parse(const QString& code);
+    // From a paper as the order names it, "10/15": its first two characters and its last two.
+    static std::optional<PaperDigits> ofPaper(const QString& paper);
 };
 
 // The box that stands for the paper: 450 wide in landscape, 300 wide in portrait. The two differ in size on purpose,

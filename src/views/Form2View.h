@@ -1,17 +1,13 @@
 #pragma once
 
 #include "assembly/Form2.h"
-#include "views/PageView.h"
+#include "views/PreparationView.h"
 
-class QFrame;
 class QListWidget;
 
 namespace lumora {
 
-class Gauge;
-class PictureBox;
-
-class Form2View : public PageView {
+class Form2View : public PreparationView {
     Q_OBJECT
 public:
     Form2View(Form2& page, const SessionState& state, const Theme& theme);
@@ -22,15 +18,10 @@ protected:
 
 private:
     Form2& m_page;
-    Gauge* m_gauge;
-    PictureBox* m_sheet;
-    QFrame* m_sheetCard;
-    QFrame* m_trouble;
     QListWidget* m_removed;
     QListWidget* m_list;
     QFrame* m_listCard;
     QPushButton* m_start;
-    QLabel* m_total;
 };
 
 } // namespace lumora

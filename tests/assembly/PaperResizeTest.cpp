@@ -6,19 +6,19 @@ namespace lumora {
 namespace {
 
 TEST(PaperResize, readsAPaperFromItsFirstAndLastTwoCharacters) {
-    EXPECT_EQ(PaperSize::parse(QStringLiteral("10/15")), (PaperSize{10, 15}));
-    EXPECT_EQ(PaperSize::parse(QStringLiteral("09/13")), (PaperSize{9, 13}));
+    EXPECT_EQ(PaperDigits::ofPaper(QStringLiteral("10/15")), (PaperDigits{10, 15}));
+    EXPECT_EQ(PaperDigits::ofPaper(QStringLiteral("09/13")), (PaperDigits{9, 13}));
     for (const char* unreadable : {"", "***", "zz/zz", "10/zz", "00/15", "-1/15"})
-        EXPECT_EQ(PaperSize::parse(QString::fromLatin1(unreadable)), std::nullopt) << unreadable;
+        EXPECT_EQ(PaperDigits::ofPaper(QString::fromLatin1(unreadable)), std::nullopt) << unreadable;
 }
 
 TEST(PaperResize, scalesToThePaperWithTiesToEvenAndNeverEnlarges) {
     struct Case {
         PictureSize source;
-        PaperSize paper;
+        PaperDigits paper;
         PictureSize target;
     };
-    constexpr PaperSize small{10, 15};
+    constexpr PaperDigits small{10, 15};
     for (const Case& c : {
              Case{{4000, 3000}, small, {1800, 1350}},
              Case{{3000, 4000}, small, {1200, 1600}},

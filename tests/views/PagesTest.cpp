@@ -1,5 +1,7 @@
 #include "Walk.h"
 
+#include "assembly/B3.h"
+#include "editing/EditRecord.h"
 #include "entry/nnn.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -182,6 +184,38 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     walk.program().state().coupon.HaKoopon = 1;
     walk.press(u"kyoskNew"_s, u"Image7"_s);
     look(walk, u"24-panel-in-front"_s);
+}
+
+TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
+    Walk walk(GetParam().size);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    SessionState& state = walk.program().state();
+    state.Optint = 2;
+    state.shemot.ppr = u"10/15"_s;
+    state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+    const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder();
+    state.handOver.lines = {code + u"\\missing picture.jpg"_s};
+    for (int i = 1; i <= 12; ++i)
+        state.handOver.lines += code + u"\\IMG_00%1.jpg"_s.arg(i, 2, 10, QChar(u'0'));
+    walk.program().chain().show(PageId::B3);
+    auto& page = walk.page<B3>(PageId::B3);
+    page.Timer2.stop();
+    look(walk, u"25-to-prepare"_s);
+    // In the middle of the work: the timer ticks while the page lets the screen update.
+    QTimer middle;
+    bool looked = false;
+    QObject::connect(&middle, &QTimer::timeout, &middle, [&] {
+        if (page.Label17.text.toInt() < 5)
+            return;
+        middle.stop();
+        looked = true;
+        look(walk, u"26-preparing-edited"_s);
+    });
+    middle.start(0);
+    page.Command5_Click();
+    EXPECT_TRUE(looked);
+    walk.waitFor(u"FtpFrm"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, PageLook,

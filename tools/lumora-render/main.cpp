@@ -53,7 +53,7 @@ Exit status: 0 all pictures done, 1 a picture failed (the others are done all th
 
 struct Request {
     enum class Mode { Plain, Small, Preview, Print } mode = Mode::Plain;
-    std::optional<PaperSize> paper;
+    std::optional<PaperDigits> paper;
     EditFields edit;
     fs::path frames;
     std::optional<QColor> background;
@@ -63,7 +63,6 @@ struct Request {
     fs::path out = ".";
     std::vector<fs::path> files;
 
-    PaperDigits digits() const { return {paper->shortSide, paper->longSide}; }
     bool isEdited() const { return mode == Mode::Preview || mode == Mode::Print; }
     bool writesPng() const { return png || mode == Mode::Small || mode == Mode::Preview; }
 };
@@ -128,7 +127,7 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
                 return refuse("--background " + *value + " is no colour; six hexadecimal digits are wanted, as FF8000");
             request.background = colour;
         } else if (name == "--paper") {
-            request.paper = PaperSize::parse(QString::fromUtf8(value->c_str()));
+            request.paper = PaperDigits::ofPaper(QString::fromUtf8(value->c_str()));
             if (!request.paper)
                 return refuse("--paper " + *value + " is no paper size; two sides in centimetres are wanted, as 10/15");
         } else if (name == "--size") {
@@ -194,7 +193,7 @@ Result<QByteArray> pngOf(const Bitmap& picture, const fs::path& source) {
 Result<QByteArray> previewPng(const Request& request, const fs::path& source, PictureTimes& times) {
     EditFields edit = request.edit;
     auto start = std::chrono::steady_clock::now();
-    auto preview = EditedPreview::open(source, request.digits(), edit.ZoomPercent,
+    auto preview = EditedPreview::open(source, *request.paper, edit.ZoomPercent,
                                        edit.ToneFlag == 1 ? EditedPreview::Tone::Grey : EditedPreview::Tone::Colour);
     times.decode = millisecondsSince(start);
     if (!preview)
@@ -214,7 +213,7 @@ Result<QByteArray> previewPng(const Request& request, const fs::path& source, Pi
 Result<QByteArray> editedPrint(const Request& request, const fs::path& source, PictureTimes& times) {
     EditedPrint print;
     print.file = source;
-    print.paper = request.digits();
+    print.paper = *request.paper;
     print.framesFolder = request.frames;
     print.background = request.background;
     if (!request.png)
