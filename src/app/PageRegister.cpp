@@ -21,6 +21,7 @@
 #include "views/FtpFrmView.h"
 #include "views/HavharotView.h"
 #include "views/MainWindow.h"
+#include "views/RedIView.h"
 #include "views/hatchalaView.h"
 #include "views/kyoskNewView.h"
 #include "views/mikledetView.h"
@@ -70,6 +71,9 @@ void registerViews(MainWindow& window, SessionState& state, const Files& files) 
     });
     window.registerView(PageId::Form3, [&](Page& page, const Theme& theme) {
         return std::make_unique<Form3View>(static_cast<Form3&>(page), state, theme);
+    });
+    window.registerView(PageId::RedI, [&](Page& page, const Theme& theme) {
+        return std::make_unique<RedIView>(static_cast<RedI&>(page), state, theme);
     });
     window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
         return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);

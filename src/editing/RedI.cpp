@@ -50,7 +50,7 @@ void RedI::load() {
     Combo1.append(wheelSteps);
     Combo1.setCurrentIndex(1);
     RedTargetRectangle.visible = false;
-    Image1.visible = Frame6.visible = Label45.visible = kofez.visible = Label4Busy.visible = false;
+    Image1.visible = Frame6.visible = Label45.visible = kofez.visible = FrameHelp.visible = Label4Busy.visible = false;
     showState();
 }
 
@@ -64,7 +64,7 @@ void RedI::open(const QString& path) {
     m_corrected = {};
     m_originals.clear();
     forgetLists();
-    RedTargetRectangle.visible = Frame6.visible = Label45.visible = kofez.visible = false;
+    RedTargetRectangle.visible = Frame6.visible = Label45.visible = kofez.visible = FrameHelp.visible = false;
     RedChanged = m_changedBefore = false;
     RedFixLevel = 0;
     m_step = Step::FindEye;
@@ -429,7 +429,7 @@ void RedI::showState() {
     Image6.enabled = Frame6.enabled = ready() && !List1.isEmpty();
     Image7.enabled = ready() && m_undo.canRestore();
     Image5.enabled = Rstor.enabled = ready() && RedChanged;
-    Image8.enabled = Command6.enabled = ready();
+    CommandMenu.enabled = Image8.enabled = Command6.enabled = ready();
     Image9.enabled = !busy;
     CommandCloser.enabled = ready() && Magnification < largestMagnification;
     CommandFurther.enabled = ready() && Magnification > 1;

@@ -105,6 +105,10 @@ public:
     void Memokad_Click();
     void Rstor_Click(); // back to the customer's picture
 
+    // Events: the instructions, all at once
+    void CommandHelp_Click();
+    void CommandHelpClose_Click();
+
     // Events: leaving
     void Image8_Click(); // accept
     void Image9_Click();
@@ -144,10 +148,14 @@ public:
     Caption Label37;                                     // level of the repeat step
     Caption Label42, Label43;                            // counts of List1 and List2
     Caption Label38, Label40, Label41, Label44, Label45; // what to do, step by step
+    Caption FrameHelp;                                   // the instructions, all at once
     Caption LabelTitle;
+    // Where the customer stands: 1 find the eye, 2 fit the circle, 3 correct, 4 accept.
+    int stepNumber() const { return static_cast<int>(m_step) + 1; }
     Caption kofez, Bsisi, amok2, amok3, amok4, amok5, amok, Memokad, Rstor;
     Caption Image2, Image5, Image6, Image7, Image8, Image9, Image10, Image11, Image12, Image13, Image14, Image15,
-        Image16, Command3, Command6, Command13, CommandCloser, CommandFurther;
+        Image16, Command3, Command6, Command13, CommandCloser, CommandFurther, CommandMenu, CommandMenuClose,
+        CommandHelp, CommandHelpClose;
 
     std::int16_t RedFixLevel = 0; // how much deeper the correction goes
     bool RedChanged = false;      // Picture1 differs from the file

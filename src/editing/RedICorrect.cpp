@@ -297,6 +297,17 @@ void RedI::kofez_Close() {
     Q_EMIT changed();
 }
 
+void RedI::CommandHelp_Click() {
+    stopHolds();
+    FrameHelp.visible = true;
+    Q_EMIT changed();
+}
+
+void RedI::CommandHelpClose_Click() {
+    FrameHelp.visible = false;
+    Q_EMIT changed();
+}
+
 void RedI::fixFromMenu(int level) {
     kofez_Close();
     RedFix(level);

@@ -75,6 +75,14 @@ void RedI::setTexts() {
     Image5.hint = say(u"מחזיר את התמונה כפי שהייתה", u"Brings the picture back as it was");
     Image8.hint = say(u"שומר את התיקונים וחוזר לעריכה", u"Keeps the corrections and goes back to the editor");
     Image9.hint = say(u"חוזר לעריכה בלי התיקונים", u"Goes back to the editor without the corrections");
+    CommandMenu.text = say(u"עוד תיקונים", u"More corrections");
+    CommandMenuClose.text = say(u"חזור לתמונה", u"Back to the picture");
+    CommandHelp.text = say(u"הסבר", u"Help");
+    CommandHelpClose.text = say(u"הבנתי", u"I see");
+    FrameHelp.text = say(u"כך מתקנים עין אדומה", u"How to correct a red eye");
+    Label40.visible = m_step != Step::Corrected;
+    Label41.visible = m_step == Step::Aim;
+    Label44.visible = m_step == Step::Corrected;
     const QString hold = say(u" (לחיצה ממושכת)", u" (press and hold)");
     for (Caption* button : {&Image10, &Image11, &Image12, &Image13, &Image14, &Image15})
         button->hint = button->text + hold;

@@ -142,6 +142,12 @@ QPushButton[role="wordKey"] { font-size: @16px; font-weight: bold; }
 QPushButton[role="key"]:pressed, QPushButton[role="wordKey"]:pressed { background: $PrimarySoft; border-color: $Primary; }
 QPushButton[role="key"]:checked, QPushButton[role="wordKey"]:checked { background: $PrimarySoft; border: 2px solid $Primary; }
 
+QPushButton[role="sky"], QPushButton[role="violet"] { padding: 0; }
+QPushButton[role="sky"] { background: $SkySoft; }
+QPushButton[role="violet"] { background: $VioletSoft; }
+QPushButton[role="sky"]:pressed, QPushButton[role="violet"]:pressed { background: $Sunken; }
+QPushButton[role="sky"]:disabled, QPushButton[role="violet"]:disabled { background: $Sunken; }
+
 QLineEdit, QPlainTextEdit, QComboBox { min-height: %targetpx; padding: 0 @14px; border: 2px solid $Edge; border-radius: @12px;
   background: $Surface; selection-background-color: $Primary; selection-color: white; font-size: @19px; }
 QPlainTextEdit { padding: @8px @10px; }
@@ -177,6 +183,8 @@ QToolTip { background: $Ink; color: white; border: none; padding: @6px @10px; }
                                                       {"$Primary", Colour::Primary},
                                                       {"$Paper", Colour::Paper},
                                                       {"$Surface", Colour::Surface},
+                                                      {"$SkySoft", Colour::SkySoft},
+                                                      {"$VioletSoft", Colour::VioletSoft},
                                                       {"$Sunken", Colour::Sunken},
                                                       {"$Line", Colour::Line},
                                                       {"$Edge", Colour::Edge},

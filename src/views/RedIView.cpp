@@ -1,0 +1,336 @@
+#include "views/RedIView.h"
+
+#include "common/DrivePathText.h"
+#include "session/SessionState.h"
+#include "views/HoldButton.h"
+#include "views/Overlay.h"
+#include "views/RedEyeCanvas.h"
+
+#include <QEvent>
+#include <QGridLayout>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
+    : PageView(page, state, theme)
+    , m_page(page) {
+    frame().steps().setStep(OrderStep::Pictures);
+    frame().setTitleVisible(false);
+
+    auto* top = new QHBoxLayout;
+    top->setSpacing(theme.px(20));
+    auto* title = label(u"LabelTitle"_s, page.LabelTitle, "large");
+    title->setWordWrap(false);
+    top->addWidget(title);
+    m_steps = new RedEyeSteps(theme, this);
+    top->addWidget(m_steps, 1);
+    frame().content()->addLayout(top);
+
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme.px(18));
+    m_canvas = new RedEyeCanvas(page, theme, this);
+    bind(u"Picture1"_s, m_canvas, [this] { return m_page.caption; });
+    row->addWidget(makeSide());
+    auto* work = new QVBoxLayout;
+    work->setSpacing(theme.px(10));
+    work->addWidget(m_canvas, 1);
+    m_readout = makeLabel(this, "smallMuted");
+    work->addWidget(m_readout);
+    work->addLayout(makeTools());
+    row->addLayout(work, 1);
+    frame().content()->addLayout(row, 1);
+
+    auto* help = button(
+        u"CommandHelp"_s, page.CommandHelp, Role::Quiet, [&page] { page.CommandHelp_Click(); }, u"info"_s);
+    frame().addHeaderAction(help);
+    frame().addSecondaryAction(button(
+        u"Image9"_s, page.Image9, Role::Secondary, [&page] { page.Image9_Click(); }, u"close"_s));
+    frame().addSecondaryAction(button(
+        u"Image7"_s, page.Image7, Role::Secondary, [&page] { page.Image7_Click(); }, u"redeye-back"_s));
+    frame().addSecondaryAction(button(
+        u"Image5"_s, page.Image5, Role::Secondary, [&page] { page.Image5_Click(); }, u"eraser"_s));
+    m_accept = button(
+        u"Image8"_s, page.Image8, Role::Main, [&page] { page.Image8_Click(); }, u"tick-white"_s);
+    frame().addMainAction(m_accept);
+
+    m_darkenBeside = button(
+        u"Frame6"_s, page.Frame6, Role::Plain, [&page] { page.Frame6_Click(); }, u"redeye-darken"_s);
+    m_closer = button(
+        u"CommandCloser"_s, page.CommandCloser, Role::Plain, [&page] { page.CommandCloser_Click(); },
+        u"redeye-closer"_s);
+    m_further = button(
+        u"CommandFurther"_s, page.CommandFurther, Role::Plain, [&page] { page.CommandFurther_Click(); },
+        u"redeye-further"_s);
+    for (QPushButton* over : {m_darkenBeside, m_closer, m_further})
+        over->setParent(m_canvas);
+    m_busy = new QFrame(m_canvas);
+    setRole(m_busy, "notice");
+    auto* wait = new QVBoxLayout(m_busy);
+    wait->setContentsMargins(theme.px(26), theme.px(18), theme.px(26), theme.px(18));
+    auto* waiting = label(u"Label4Busy"_s, page.Label4Busy, "large");
+    waiting->setWordWrap(false);
+    wait->addWidget(waiting);
+    connect(m_canvas, &RedEyeCanvas::resized, this, &RedIView::placeOverPicture);
+
+    makeMenu();
+    makeHelp();
+    bindTheRest();
+    start();
+}
+
+QWidget* RedIView::firstFocus() const {
+    return m_canvas;
+}
+
+void RedIView::escape() {
+    if (m_page.kofez.visible)
+        m_page.kofez_Close();
+    else if (m_page.FrameHelp.visible)
+        m_page.CommandHelpClose_Click();
+}
+
+QWidget* RedIView::makeSide() {
+    auto* side = new QWidget(this);
+    side->setFixedWidth(theme().px(276));
+    auto* column = new QVBoxLayout(side);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme().px(10));
+
+    m_overview = new RedEyeOverview(m_page, theme(), *m_canvas, side);
+    bind(u"Picture3"_s, m_overview, [this] { return m_page.caption; });
+    column->addWidget(m_overview, 0, Qt::AlignHCenter);
+
+    auto* words = new QFrame(side);
+    setRole(words, "card");
+    auto* wordsColumn = new QVBoxLayout(words);
+    wordsColumn->setContentsMargins(theme().px(14), theme().px(8), theme().px(14), theme().px(8));
+    wordsColumn->setSpacing(theme().px(4));
+    wordsColumn->addWidget(label(u"Label40"_s, m_page.Label40, "small"));
+    auto* aimed = label(u"Label41"_s, m_page.Label41, "small");
+    wordsColumn->addWidget(aimed);
+    wordsColumn->addWidget(label(u"Label44"_s, m_page.Label44));
+    m_notice = new QFrame(words);
+    setRole(m_notice, "notice");
+    auto* noticeColumn = new QVBoxLayout(m_notice);
+    noticeColumn->setContentsMargins(theme().px(12), theme().px(6), theme().px(12), theme().px(6));
+    noticeColumn->addWidget(label(u"Label45"_s, m_page.Label45, "small"));
+    wordsColumn->addWidget(m_notice);
+    wordsColumn->addStretch(1);
+    column->addWidget(words, 1);
+    column->addLayout(makePad());
+    return side;
+}
+
+HoldButton* RedIView::hold(const QString& name, const Caption& caption, const char* role, const QString& icon,
+                           std::function<void()> down, std::function<void()> up) {
+    RedI& page = m_page;
+    auto* made = new HoldButton({std::move(down), [&page] { page.tickOnceIfNone(); }, std::move(up)}, this);
+    setRole(made, role);
+    setIcon(made, icon, Theme::Colour::Ink);
+    bind(name, made, caption);
+    made->setProperty("iconOnly", true);
+    return made;
+}
+
+// The arrows round the middle, the two sizes in the upper corners. The pad is a map of the picture: it is not mirrored
+// with the language.
+QLayout* RedIView::makePad() {
+    RedI& page = m_page;
+    const auto arrowUp = [&page] { page.Arrow_MouseUp(); };
+    const auto sized = [&page] { page.Size_MouseUp(); };
+    auto* up = hold(
+        u"Image12"_s, page.Image12, "sky", u"arrow-up"_s, [&page] { page.Image12_MouseDown(); }, arrowUp);
+    auto* down = hold(
+        u"Image13"_s, page.Image13, "sky", u"arrow-down"_s, [&page] { page.Image13_MouseDown(); }, arrowUp);
+    auto* left = hold(
+        u"Image14"_s, page.Image14, "sky", u"arrow-left"_s, [&page] { page.Image14_MouseDown(); }, arrowUp);
+    auto* right = hold(
+        u"Image15"_s, page.Image15, "sky", u"arrow-right"_s, [&page] { page.Image15_MouseDown(); }, arrowUp);
+    auto* smaller = hold(
+        u"Image10"_s, page.Image10, "violet", u"redeye-smaller"_s, [&page] { page.Image10_MouseDown(); }, sized);
+    auto* larger = hold(
+        u"Image11"_s, page.Image11, "violet", u"redeye-larger"_s, [&page] { page.Image11_MouseDown(); }, sized);
+    auto* pad = new QWidget(this);
+    pad->setLayoutDirection(Qt::LeftToRight);
+    auto* grid = new QGridLayout(pad);
+    grid->setContentsMargins(0, 0, 0, 0);
+    grid->setSpacing(theme().px(6));
+    grid->addWidget(smaller, 0, 0);
+    grid->addWidget(up, 0, 1);
+    grid->addWidget(larger, 0, 2);
+    grid->addWidget(left, 1, 0);
+    grid->addWidget(down, 1, 1);
+    grid->addWidget(right, 1, 2);
+    for (int i = 0; i < 3; ++i)
+        grid->setColumnStretch(i, 1);
+    auto* row = new QHBoxLayout;
+    row->addWidget(pad);
+    return row;
+}
+
+QLayout* RedIView::makeTools() {
+    RedI& page = m_page;
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme().px(10));
+    row->addWidget(button(
+        u"CommandMenu"_s, page.CommandMenu, Role::Quiet, [&page] { page.kofez_Open(); }, u"redeye-more"_s));
+    row->addStretch(1);
+    m_darken = button(
+        u"Image6"_s, page.Image6, Role::Secondary, [&page] { page.Image6_Click(); }, u"redeye-darken"_s);
+    m_darken->installEventFilter(this);
+    row->addWidget(m_darken);
+    row->addWidget(button(
+        u"Image16"_s, page.Image16, Role::Secondary, [&page] { page.Image16_Click(); }, u"redeye-deeper"_s));
+    m_correct = button(
+        u"Image2"_s, page.Image2, Role::Main, [&page] { page.Image2_Click(); }, u"redeye-correct"_s);
+    row->addWidget(m_correct);
+    return row;
+}
+
+void RedIView::makeMenu() {
+    RedI& page = m_page;
+    m_menu = new Overlay(theme(), this);
+    m_menu->setCardWidth(660);
+    m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, page.CommandMenu, "title"));
+    auto* grid = new QGridLayout;
+    grid->setSpacing(theme().px(10));
+    int place = 0;
+    const auto item = [&](const QString& name, const Caption& caption, Role role, std::function<void()> pressed,
+                          const QString& icon) {
+        grid->addWidget(button(name, caption, role, std::move(pressed), icon), place / 2, place % 2);
+        ++place;
+    };
+    item(
+        u"Bsisi"_s, page.Bsisi, Role::Plain, [&page] { page.Bsisi_Click(); }, u"redeye-correct"_s);
+    item(
+        u"amok2"_s, page.amok2, Role::Plain, [&page] { page.amok2_Click(); }, u"redeye-correct"_s);
+    item(
+        u"amok3"_s, page.amok3, Role::Plain, [&page] { page.amok3_Click(); }, u"redeye-correct"_s);
+    item(
+        u"amok4"_s, page.amok4, Role::Plain, [&page] { page.amok4_Click(); }, u"redeye-correct"_s);
+    item(
+        u"amok5"_s, page.amok5, Role::Plain, [&page] { page.amok5_Click(); }, u"redeye-correct"_s);
+    item(
+        u"amok"_s, page.amok, Role::Plain, [&page] { page.amok_Click(); }, u"redeye-deeper"_s);
+    item(
+        u"Memokad"_s, page.Memokad, Role::Plain, [&page] { page.Memokad_Click(); }, u"redeye-correct"_s);
+    item(
+        u"Command3"_s, page.Command3, Role::Plain, [&page] { page.Command3_Click(); }, u"redeye-smaller"_s);
+    item(
+        u"Rstor"_s, page.Rstor, Role::Danger, [&page] { page.Rstor_Click(); }, u"eraser"_s);
+    auto* back = button(u"CommandMenuClose"_s, page.CommandMenuClose, Role::Secondary, [&page] { page.kofez_Close(); });
+    grid->addWidget(back, place / 2, place % 2);
+    m_menu->column()->addLayout(grid);
+    m_menu->setFirstFocus(back);
+    connect(m_menu, &Overlay::escaped, this, [&page] { page.kofez_Close(); });
+}
+
+void RedIView::makeHelp() {
+    RedI& page = m_page;
+    m_help = new Overlay(theme(), this);
+    m_help->setCardWidth(640);
+    m_help->column()->addWidget(label(u"FrameHelp"_s, page.FrameHelp, "title"));
+    m_help->column()->addWidget(label(u"Label38"_s, page.Label38));
+    m_helpText = makeLabel(m_help, "muted");
+    m_help->column()->addWidget(m_helpText);
+    auto* close =
+        button(u"CommandHelpClose"_s, page.CommandHelpClose, Role::Main, [&page] { page.CommandHelpClose_Click(); });
+    m_help->column()->addWidget(close, 0, Qt::AlignTrailing);
+    m_help->setFirstFocus(close);
+    connect(m_help, &Overlay::escaped, this, [&page] { page.CommandHelpClose_Click(); });
+}
+
+void RedIView::bindTheRest() {
+    RedI& page = m_page;
+    bindHidden(u"kofez"_s, page.kofez);
+    bindHidden(u"RedTargetRectangle"_s, page.RedTargetRectangle);
+    bindHidden(u"Image1"_s, page.Image1);
+    bindHidden(u"Command6"_s, page.Command6);
+    bindHidden(u"Command13"_s, page.Command13);
+    const std::pair<const char*, const Caption*> operators[] = {
+        {"Label1", &page.Label1},   {"Label2", &page.Label2},   {"Label3", &page.Label3},   {"Label6", &page.Label6},
+        {"Label12", &page.Label12}, {"Label13", &page.Label13}, {"Label16", &page.Label16}, {"Label17", &page.Label17},
+        {"Label24", &page.Label24}, {"Label25", &page.Label25}, {"Label27", &page.Label27}, {"Label28", &page.Label28},
+        {"Label30", &page.Label30}, {"Label31", &page.Label31}, {"Label37", &page.Label37}, {"Label42", &page.Label42},
+        {"Label43", &page.Label43}, {"Rlbl", &page.Rlbl},       {"Glbl", &page.Glbl},       {"Blbl", &page.Blbl}};
+    for (const auto& [name, caption] : operators)
+        bindHidden(QString::fromLatin1(name), *caption);
+    bindList(u"List1"_s, page.List1);
+    bindList(u"List2"_s, page.List2);
+    bindList(u"Combo1"_s, page.Combo1);
+}
+
+bool RedIView::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == m_darken && event->type() == QEvent::Enter && m_darken->isEnabled() && !isDetached())
+        m_page.Image6_MouseMove();
+    return PageView::eventFilter(watched, event);
+}
+
+// What lies over the picture: the two glasses in an upper corner, the darkening button beside the patch, what the
+// customer waits for in the middle.
+void RedIView::placeOverPicture() {
+    if (isDetached() || !m_busy)
+        return;
+    const int edge = theme().px(10);
+    int x = edge;
+    for (QPushButton* glass : {m_closer, m_further}) {
+        glass->adjustSize();
+        glass->move(x, edge);
+        x += glass->width() + theme().px(6);
+    }
+    m_darkenBeside->adjustSize();
+    const QPointF wanted = m_canvas->onWidget(m_page.Frame6Place);
+    const QRect room = m_canvas->rect().adjusted(edge, edge, -edge, -edge);
+    m_darkenBeside->move(
+        std::clamp(static_cast<int>(wanted.x()), room.left(),
+                   std::max(room.left(), room.right() - m_darkenBeside->width())),
+        std::clamp(static_cast<int>(wanted.y()), room.top() + m_closer->height() + edge,
+                   std::max(room.top() + m_closer->height() + edge, room.bottom() - m_darkenBeside->height())));
+    m_busy->adjustSize();
+    m_busy->move((m_canvas->width() - m_busy->width()) / 2, (m_canvas->height() - m_busy->height()) / 2);
+}
+
+void RedIView::render() {
+    m_steps->show({wording(u"הקש על העין האדומה"_s, u"Tap the red eye"_s),
+                   wording(u"התאם את העיגול לאישון"_s, u"Fit the circle to the pupil"_s),
+                   wording(u"לחץ על תיקון"_s, u"Press Correct"_s), wording(u"אשר את התמונה"_s, u"Press Accept"_s)},
+                  m_page.stepNumber());
+    m_overview->fit();
+    m_canvas->update();
+    speak(m_canvas, wording(u"התמונה: %1"_s, u"The picture: %1"_s).arg(LeafName(m_page.caption)));
+    speak(m_overview, wording(u"התמונה כולה, הקש על העין האדומה"_s, u"The whole picture: tap the red eye"_s));
+    for (const auto& [widget, caption] : {std::pair<const char*, const Caption*>{"Image10", &m_page.Image10},
+                                          {"Image11", &m_page.Image11},
+                                          {"Image12", &m_page.Image12},
+                                          {"Image13", &m_page.Image13},
+                                          {"Image14", &m_page.Image14},
+                                          {"Image15", &m_page.Image15},
+                                          {"CommandCloser", &m_page.CommandCloser},
+                                          {"CommandFurther", &m_page.CommandFurther}}) {
+        if (auto* made = findChild<QPushButton*>(QString::fromLatin1(widget))) {
+            made->setText({}); // the sign says it; the words are its hint
+            made->setAccessibleName(caption->text);
+        }
+    }
+    m_busy->setVisible(m_page.Label4Busy.visible);
+    m_notice->setVisible(m_page.Label45.visible);
+    m_readout->setVisible(state().DegelEdit);
+    m_readout->setText(isolated(u"R %1 G %2 B %3 · %4 − %5 = %6 · %7"_s.arg(
+        m_page.Rlbl.text, m_page.Glbl.text, m_page.Blbl.text, m_page.Label3.text, m_page.Label12.text,
+        m_page.Label24.text, m_page.Label28.text)));
+    m_helpText->setText(
+        isolated(m_page.Label41.text + u'\n' + m_page.Label44.text.trimmed() + u'\n' + m_page.Label45.text.trimmed()));
+    m_menu->setOpen(m_page.kofez.visible);
+    m_help->setOpen(m_page.FrameHelp.visible);
+    placeOverPicture();
+}
+
+} // namespace lumora

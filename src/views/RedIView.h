@@ -1,0 +1,55 @@
+#pragma once
+
+#include "editing/RedI.h"
+#include "views/PageView.h"
+
+class QFrame;
+
+namespace lumora {
+
+class HoldButton;
+class RedEyeCanvas;
+class RedEyeOverview;
+class RedEyeSteps;
+
+class RedIView : public PageView {
+    Q_OBJECT
+public:
+    RedIView(RedI& page, const SessionState& state, const Theme& theme);
+    QWidget* firstFocus() const override;
+    void escape() override;
+
+protected:
+    void render() override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    QWidget* makeSide();
+    QLayout* makePad();
+    QLayout* makeTools();
+    HoldButton* hold(const QString& name, const Caption& caption, const char* role, const QString& icon,
+                     std::function<void()> down, std::function<void()> up);
+    void makeMenu();
+    void makeHelp();
+    void placeOverPicture();
+    void bindTheRest();
+
+    RedI& m_page;
+    RedEyeSteps* m_steps;
+    RedEyeCanvas* m_canvas;
+    RedEyeOverview* m_overview = nullptr;
+    QPushButton* m_correct = nullptr;
+    QPushButton* m_accept = nullptr;
+    QPushButton* m_darken = nullptr;
+    QPushButton* m_darkenBeside = nullptr;
+    QPushButton* m_closer = nullptr;
+    QPushButton* m_further = nullptr;
+    QFrame* m_busy = nullptr;
+    QFrame* m_notice = nullptr;
+    QLabel* m_readout = nullptr;
+    QLabel* m_helpText = nullptr;
+    Overlay* m_menu = nullptr;
+    Overlay* m_help = nullptr;
+};
+
+} // namespace lumora

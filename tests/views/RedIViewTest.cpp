@@ -1,0 +1,197 @@
+#include "Walk.h"
+
+#include "editing/RedEye.h"
+#include "editing/RedI.h"
+#include "imaging/PictureFile.h"
+#include "platform/Files.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/SamplePhotographs.h"
+#include "views/MainWindow.h"
+#include "views/PageView.h"
+
+#include <QPainter>
+#include <QTest>
+#include <QWheelEvent>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+struct Screen {
+    QSize size;
+    bool english;
+};
+
+void PrintTo(const Screen& screen, std::ostream* out) {
+    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
+}
+
+constexpr PictureSize photograph{2400, 1800};
+constexpr QPoint eye{900, 700};
+constexpr QPoint otherEye{1120, 690};
+
+// A face with two red eyes in a photograph.
+Bitmap flashPhotograph() {
+    Bitmap picture = samplePhotograph(photograph, 5);
+    QPainter painter(&picture.image());
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(QColor(222, 178, 150));
+    painter.drawEllipse(QPoint(1010, 790), 330, 420);
+    for (const QPoint at : {eye, otherEye}) {
+        painter.setBrush(QColor(244, 240, 236));
+        painter.drawEllipse(at, 62, 34);
+        painter.setBrush(QColor(96, 62, 40));
+        painter.drawEllipse(at, 30, 30);
+        painter.setBrush(QColor(205, 34, 44));
+        painter.drawEllipse(at, 17, 17);
+        painter.setBrush(Qt::white);
+        painter.drawEllipse(at + QPoint(5, -6), 4, 4);
+    }
+    painter.setPen(QPen(QColor(180, 92, 88), 14, Qt::SolidLine, Qt::RoundCap));
+    painter.drawArc(QRect(890, 880, 240, 130), 200 * 16, 140 * 16);
+    return picture;
+}
+
+class RedEyeView : public ::testing::TestWithParam<Screen> {
+protected:
+    RedEyeView()
+        : walk(GetParam().size) {
+        if (GetParam().english)
+            walk.press(u"hatchala"_s, u"Check1"_s);
+        const QString path = walk.pictureFolder() + u"\\IMG_0001.jpg"_s;
+        EXPECT_TRUE(saveJpeg(flashPhotograph(), *walk.program().platform().files.drives().toHost(path), 95).ok());
+        walk.program().state().edit.PicturePath = path;
+        static_cast<RedI&>(walk.program().chain().load(PageId::RedI)).open(path);
+        walk.waitFor(u"RedI"_s);
+    }
+    RedI& page() { return walk.page<RedI>(PageId::RedI); }
+    QWidget& control(const QString& name) { return *walk.program().window().frontView()->control(name)->widget; }
+    void press(const QString& name) { walk.press(u"RedI"_s, name); }
+    // Where the page's overview shows a point of the picture, in percent.
+    void pressOverview(QPoint at) {
+        const QPointF percent(100.0 * at.x() / photograph.width, 100.0 * at.y() / photograph.height);
+        const Result<void> pressed =
+            ControlFinder(walk.program().window()).pressAt(u"RedI"_s, u"Picture3"_s, percent, Qt::LeftButton);
+        ASSERT_TRUE(pressed.ok()) << qPrintable(pressed.failure().message);
+        walk.settle();
+    }
+    void look(const QString& name) {
+        walk.settle(60);
+        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
+        for (const QString& fault : walk.faults(GetParam().english))
+            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
+    }
+
+    Walk walk;
+};
+
+} // namespace
+
+TEST_P(RedEyeView, LeadsFromTheEyeToTheCorrectionWithEveryControlInReach) {
+    look(u"redi-1-find"_s);
+    EXPECT_FALSE(walk.pressable(u"RedI"_s, u"Image2"_s));
+    pressOverview(eye);
+    EXPECT_LT((QPoint(page().RedSearchX, page().RedSearchY) - eye).manhattanLength(), 24);
+    look(u"redi-2-place"_s);
+
+    // A tap in the middle of the picture picks the pixel that lies there.
+    const QPoint before(page().RedSearchX, page().RedSearchY);
+    QWidget& canvas = control(u"Picture1"_s);
+    QTest::mouseClick(&canvas, Qt::LeftButton, {}, canvas.rect().center());
+    EXPECT_LE((QPoint(page().RedSearchX, page().RedSearchY) - before).manhattanLength(), 2);
+    while (page().RedSearchX < eye.x())
+        press(u"Image15"_s); // a tap is one step
+    while (page().RedSearchX > eye.x() + 1)
+        press(u"Image14"_s);
+    while (page().RedSearchY < eye.y())
+        press(u"Image13"_s);
+    while (page().RedSearchY > eye.y() + 1)
+        press(u"Image12"_s);
+    const int size = page().circle().width();
+    press(u"Image11"_s);
+    EXPECT_EQ(page().circle().width(), size + 1);
+    press(u"Image10"_s);
+    EXPECT_EQ(page().circle().width(), size);
+    QWheelEvent turn(canvas.rect().center(), canvas.mapToGlobal(canvas.rect().center()), {}, {0, 120}, Qt::NoButton,
+                     Qt::NoModifier, Qt::NoScrollPhase, false);
+    for (int i = 0; i < 8; ++i)
+        QCoreApplication::sendEvent(&canvas, &turn);
+    EXPECT_EQ(page().circle().width(), size + 16);
+    look(u"redi-3-aim"_s);
+
+    press(u"Image2"_s);
+    EXPECT_TRUE(page().RedChanged);
+    EXPECT_LT(RedEye::redness(page().Picture1.image().pixel(eye)), 20);
+    look(u"redi-4-corrected"_s);
+    press(u"Frame6"_s);
+    press(u"Image6"_s);
+    look(u"redi-5-darkened"_s);
+    for (const QString& name : {u"Image16"_s, u"Image7"_s, u"CommandCloser"_s, u"CommandFurther"_s, u"Image5"_s})
+        EXPECT_TRUE(walk.pressable(u"RedI"_s, name)) << qPrintable(name);
+    press(u"Image7"_s);
+    EXPECT_GT(RedEye::redness(page().Picture1.image().pixel(eye)), 200);
+}
+
+TEST_P(RedEyeView, OpensItsMenuByTheRightButtonALongPressAndAButton) {
+    pressOverview(eye);
+    QWidget& canvas = control(u"Picture1"_s);
+    const QPoint middle = canvas.rect().center();
+    QTest::mouseClick(&canvas, Qt::RightButton, {}, middle);
+    walk.settle();
+    look(u"redi-6-menu"_s);
+    press(u"CommandMenuClose"_s);
+
+    const QPoint before(page().RedSearchX, page().RedSearchY);
+    QTest::mousePress(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
+    walk.settle(750);
+    EXPECT_TRUE(page().kofez.visible);
+    QTest::mouseRelease(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
+    EXPECT_EQ(QPoint(page().RedSearchX, page().RedSearchY), before); // it was no pick
+    press(u"Memokad"_s);
+
+    for (const QString& item : {u"Bsisi"_s, u"amok2"_s, u"amok3"_s, u"amok4"_s, u"amok5"_s, u"amok"_s, u"Command3"_s}) {
+        press(u"CommandMenu"_s);
+        press(item);
+        EXPECT_FALSE(page().kofez.visible) << qPrintable(item);
+        EXPECT_TRUE(page().RedChanged) << qPrintable(item);
+        press(u"CommandMenu"_s);
+        press(u"Rstor"_s);
+        EXPECT_FALSE(page().RedChanged) << qPrintable(item);
+    }
+    press(u"CommandHelp"_s);
+    look(u"redi-7-help"_s);
+    press(u"CommandHelpClose"_s);
+}
+
+TEST_P(RedEyeView, FollowsADragAndStopsAHoldWhenThePointerGoes) {
+    pressOverview(eye);
+    const double left = page().Picture1Left;
+    const Result<void> dragged =
+        ControlFinder(walk.program().window()).drag(u"RedI"_s, u"Picture1"_s, {60, 60}, {40, 60});
+    ASSERT_TRUE(dragged.ok()) << qPrintable(dragged.failure().message);
+    EXPECT_LT(page().Picture1Left, left - 50);
+    QWidget& right = control(u"Image15"_s);
+    QTest::mousePress(&right, Qt::LeftButton);
+    EXPECT_TRUE(page().Timer5.running());
+    const int x = page().RedSearchX;
+    walk.settle(350);
+    EXPECT_GE(page().RedSearchX, x + 4);
+    QTest::mouseRelease(&right, Qt::LeftButton);
+    EXPECT_FALSE(page().Timer5.running());
+    press(u"Image9"_s);
+    walk.settle();
+    EXPECT_FALSE(walk.program().chain().find(PageId::RedI));
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView,
+                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
+                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+
+} // namespace lumora
