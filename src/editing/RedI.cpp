@@ -107,7 +107,7 @@ void RedI::open(const QString& path) {
 
     const int longer = std::max(Picture1.width(), Picture1.height());
     m_circleSize = std::clamp(longer / 100, 12, 80);
-    Magnification = m_circleSize >= 60 ? 1 : m_circleSize >= 30 ? 2 : 4;
+    Magnification = m_circleSize >= 48 ? 1 : m_circleSize >= 24 ? 2 : 4;
     RedSearchX = Picture1.width() / 2;
     RedSearchY = Picture1.height() / 2;
     bringToCentre(QPoint(RedSearchX, RedSearchY));

@@ -11,6 +11,7 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
+#include <QStyle>
 #include <QVBoxLayout>
 
 #include <algorithm>
@@ -18,6 +19,19 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+// Without the blanks and empty lines that lead and trail: in a line from right to left they would push its first letter
+// over the edge.
+QString linesOf(const QString& text) {
+    QStringList lines = text.trimmed().split(u'\n');
+    for (QString& line : lines)
+        line = line.trimmed();
+    return lines.join(u'\n');
+}
+
+} // namespace
 
 RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
@@ -63,13 +77,15 @@ RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
 
     m_darkenBeside = button(
         u"Frame6"_s, page.Frame6, Role::Plain, [&page] { page.Frame6_Click(); }, u"redeye-darken"_s);
-    m_closer = button(
-        u"CommandCloser"_s, page.CommandCloser, Role::Plain, [&page] { page.CommandCloser_Click(); },
-        u"redeye-closer"_s);
-    m_further = button(
-        u"CommandFurther"_s, page.CommandFurther, Role::Plain, [&page] { page.CommandFurther_Click(); },
-        u"redeye-further"_s);
-    for (QPushButton* over : {m_darkenBeside, m_closer, m_further})
+    m_more = button(
+        u"CommandMenu"_s, page.CommandMenu, Role::Plain, [&page] { page.kofez_Open(); }, u"redeye-more"_s);
+    m_closer = new QPushButton(this);
+    connect(m_closer, &QPushButton::clicked, this, [&page] { page.CommandCloser_Click(); });
+    bindSign(u"CommandCloser"_s, m_closer, u"redeye-closer"_s, page.CommandCloser);
+    m_further = new QPushButton(this);
+    connect(m_further, &QPushButton::clicked, this, [&page] { page.CommandFurther_Click(); });
+    bindSign(u"CommandFurther"_s, m_further, u"redeye-further"_s, page.CommandFurther);
+    for (QPushButton* over : {m_darkenBeside, m_closer, m_further, m_more})
         over->setParent(m_canvas);
     m_busy = new QFrame(m_canvas);
     setRole(m_busy, "notice");
@@ -108,25 +124,32 @@ QWidget* RedIView::makeSide() {
     bind(u"Picture3"_s, m_overview, [this] { return m_page.caption; });
     column->addWidget(m_overview, 0, Qt::AlignHCenter);
 
-    auto* words = new QFrame(side);
-    setRole(words, "card");
-    auto* wordsColumn = new QVBoxLayout(words);
+    auto* card = new QFrame(side);
+    setRole(card, "card");
+    auto* wordsColumn = new QVBoxLayout(card);
     wordsColumn->setContentsMargins(theme().px(14), theme().px(8), theme().px(14), theme().px(8));
     wordsColumn->setSpacing(theme().px(4));
-    wordsColumn->addWidget(label(u"Label40"_s, m_page.Label40, "small"));
-    auto* aimed = label(u"Label41"_s, m_page.Label41, "small");
-    wordsColumn->addWidget(aimed);
-    wordsColumn->addWidget(label(u"Label44"_s, m_page.Label44));
-    m_notice = new QFrame(words);
+    m_guide = words(u"Label40"_s, m_page.Label40);
+    wordsColumn->addWidget(m_guide);
+    wordsColumn->addWidget(words(u"Label41"_s, m_page.Label41));
+    wordsColumn->addWidget(words(u"Label44"_s, m_page.Label44));
+    m_notice = new QFrame(card);
     setRole(m_notice, "notice");
     auto* noticeColumn = new QVBoxLayout(m_notice);
     noticeColumn->setContentsMargins(theme().px(12), theme().px(6), theme().px(12), theme().px(6));
-    noticeColumn->addWidget(label(u"Label45"_s, m_page.Label45, "small"));
+    noticeColumn->addWidget(words(u"Label45"_s, m_page.Label45));
     wordsColumn->addWidget(m_notice);
     wordsColumn->addStretch(1);
-    column->addWidget(words, 1);
+    column->addWidget(card, 1);
     column->addLayout(makePad());
     return side;
+}
+
+QLabel* RedIView::words(const QString& name, const Caption& caption) {
+    auto* made = makeLabel(this, "small");
+    bind(name, made, [&caption] { return caption.text; });
+    m_words.emplace_back(made, &caption);
+    return made;
 }
 
 HoldButton* RedIView::hold(const QString& name, const Caption& caption, const char* role, const QString& icon,
@@ -134,10 +157,15 @@ HoldButton* RedIView::hold(const QString& name, const Caption& caption, const ch
     RedI& page = m_page;
     auto* made = new HoldButton({std::move(down), [&page] { page.tickOnceIfNone(); }, std::move(up)}, this);
     setRole(made, role);
-    setIcon(made, icon, Theme::Colour::Ink);
-    bind(name, made, caption);
-    made->setProperty("iconOnly", true);
+    bindSign(name, made, icon, caption);
     return made;
+}
+
+void RedIView::bindSign(const QString& name, QPushButton* button, const QString& icon, const Caption& caption) {
+    button->setFocusPolicy(Qt::TabFocus);
+    setIcon(button, icon, Theme::Colour::Ink);
+    bind(name, button, [&caption] { return caption.text; });
+    m_signs.emplace_back(button, &caption);
 }
 
 // The arrows round the middle, the two sizes in the upper corners. The pad is a map of the picture: it is not mirrored
@@ -180,8 +208,6 @@ QLayout* RedIView::makeTools() {
     RedI& page = m_page;
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().px(10));
-    row->addWidget(button(
-        u"CommandMenu"_s, page.CommandMenu, Role::Quiet, [&page] { page.kofez_Open(); }, u"redeye-more"_s));
     row->addStretch(1);
     m_darken = button(
         u"Image6"_s, page.Image6, Role::Secondary, [&page] { page.Image6_Click(); }, u"redeye-darken"_s);
@@ -280,6 +306,8 @@ void RedIView::placeOverPicture() {
     if (isDetached() || !m_busy)
         return;
     const int edge = theme().px(10);
+    m_more->adjustSize();
+    m_more->move(m_canvas->width() - m_more->width() - edge, edge);
     int x = edge;
     for (QPushButton* glass : {m_closer, m_further}) {
         glass->adjustSize();
@@ -299,26 +327,27 @@ void RedIView::placeOverPicture() {
 }
 
 void RedIView::render() {
-    m_steps->show({wording(u"הקש על העין האדומה"_s, u"Tap the red eye"_s),
-                   wording(u"התאם את העיגול לאישון"_s, u"Fit the circle to the pupil"_s),
-                   wording(u"לחץ על תיקון"_s, u"Press Correct"_s), wording(u"אשר את התמונה"_s, u"Press Accept"_s)},
+    m_steps->show({wording(u"הקש על העין"_s, u"Tap the red eye"_s), wording(u"התאם את העיגול"_s, u"Fit the circle"_s),
+                   wording(u"לחץ על תיקון"_s, u"Press Correct"_s), wording(u"אשר את התמונה"_s, u"Accept"_s)},
                   m_page.stepNumber());
     m_overview->fit();
     m_canvas->update();
     speak(m_canvas, wording(u"התמונה: %1"_s, u"The picture: %1"_s).arg(LeafName(m_page.caption)));
     speak(m_overview, wording(u"התמונה כולה, הקש על העין האדומה"_s, u"The whole picture: tap the red eye"_s));
-    for (const auto& [widget, caption] : {std::pair<const char*, const Caption*>{"Image10", &m_page.Image10},
-                                          {"Image11", &m_page.Image11},
-                                          {"Image12", &m_page.Image12},
-                                          {"Image13", &m_page.Image13},
-                                          {"Image14", &m_page.Image14},
-                                          {"Image15", &m_page.Image15},
-                                          {"CommandCloser", &m_page.CommandCloser},
-                                          {"CommandFurther", &m_page.CommandFurther}}) {
-        if (auto* made = findChild<QPushButton*>(QString::fromLatin1(widget))) {
-            made->setText({}); // the sign says it; the words are its hint
-            made->setAccessibleName(caption->text);
-        }
+    for (const auto& [sign, caption] : m_signs) {
+        sign->setEnabled(caption->enabled);
+        sign->setToolTip(caption->hint.isEmpty() ? caption->text : caption->hint);
+        sign->setAccessibleName(caption->text);
+    }
+    for (const auto& [label, caption] : m_words) {
+        label->setText(isolated(linesOf(caption->text)));
+        label->setVisible(caption->visible);
+    }
+    // The longest of the instructions alone needs the small letters.
+    const char* type = m_page.Label41.visible ? "small" : "body";
+    if (m_guide->property("type") != QLatin1String(type)) {
+        m_guide->setProperty("type", type);
+        m_guide->style()->polish(m_guide);
     }
     m_busy->setVisible(m_page.Label4Busy.visible);
     m_notice->setVisible(m_page.Label45.visible);

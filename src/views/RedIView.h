@@ -3,6 +3,9 @@
 #include "editing/RedI.h"
 #include "views/PageView.h"
 
+#include <utility>
+#include <vector>
+
 class QFrame;
 
 namespace lumora {
@@ -27,6 +30,10 @@ private:
     QWidget* makeSide();
     QLayout* makePad();
     QLayout* makeTools();
+    // A button that shows its sign alone; the words are its hint and its spoken meaning.
+    void bindSign(const QString& name, QPushButton* button, const QString& icon, const Caption& caption);
+    // A label of instructions; the blanks at the ends of its lines are not shown.
+    QLabel* words(const QString& name, const Caption& caption);
     HoldButton* hold(const QString& name, const Caption& caption, const char* role, const QString& icon,
                      std::function<void()> down, std::function<void()> up);
     void makeMenu();
@@ -44,6 +51,10 @@ private:
     QPushButton* m_darkenBeside = nullptr;
     QPushButton* m_closer = nullptr;
     QPushButton* m_further = nullptr;
+    QPushButton* m_more = nullptr;
+    std::vector<std::pair<QPushButton*, const Caption*>> m_signs;
+    std::vector<std::pair<QLabel*, const Caption*>> m_words;
+    QLabel* m_guide = nullptr;
     QFrame* m_busy = nullptr;
     QFrame* m_notice = nullptr;
     QLabel* m_readout = nullptr;
