@@ -1,11 +1,10 @@
 // Luma of prints against an antialiased bicubic in double precision: before encoding, and what quality 90 loses beside
 // the exact picture encoded in the same way.
 
-#include "common/HostFile.h"
+#include "Floor.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/PlaneScaler.h"
 #include "imaging/Resample.h"
-#include "support/ReferenceScaling.h"
 
 #include <QTemporaryDir>
 
@@ -17,49 +16,11 @@ using namespace lumora;
 
 namespace {
 
-class WholePlanes : public PlaneTaker {
-public:
-    void begin(const std::vector<PlaneLayout>& planes) override {
-        m_layouts = planes;
-        for (const PlaneLayout& plane : planes)
-            m_rows.emplace_back(static_cast<std::size_t>(plane.height + plane.rowsAtOnce) *
-                                static_cast<std::size_t>(plane.rowBytes));
-    }
-    unsigned char* row(int plane, int y) override {
-        const auto i = static_cast<std::size_t>(plane);
-        return m_rows[i].data() + std::ptrdiff_t{y} * m_layouts[i].rowBytes;
-    }
-    void rowsReady() override {}
-
-    const std::vector<PlaneLayout>& layouts() const { return m_layouts; }
-    ReferencePlane plane(int index) {
-        const PlaneLayout& layout = m_layouts[static_cast<std::size_t>(index)];
-        ReferencePlane plane{layout.width, layout.height, {}};
-        for (int y = 0; y < layout.height; ++y)
-            plane.samples.insert(plane.samples.end(), row(index, y), row(index, y) + layout.width);
-        return plane;
-    }
-
-private:
-    std::vector<PlaneLayout> m_layouts;
-    std::vector<std::vector<unsigned char>> m_rows;
-};
-
-bool readWhole(const std::filesystem::path& path, WholePlanes& planes) {
-    auto input = PictureInput::open(path);
-    if (!input)
-        return false;
-    auto reader = JpegReader::open(std::move(*input));
-    return reader && (*reader)->readPlanes(1, planes);
-}
-
 ReferencePlane lumaOfJpeg(const QByteArray& bytes) {
     const QTemporaryDir folder;
     const std::filesystem::path path = folder.path().toStdString() + "/a.jpg";
-    WholePlanes planes;
-    if (!writeWholeFile(path, bytes) || !readWhole(path, planes))
-        return {};
-    return planes.plane(0);
+    writeBytes(path, bytes);
+    return wholePlanesOf(path).plane(0);
 }
 
 // The exact planes, rounded, through the same encoder.
@@ -100,8 +61,8 @@ int main(int argc, char** argv) {
     double worst = 1000;
     double mostLost = 0;
     for (int i = 1; i < argc; ++i) {
-        WholePlanes whole;
-        if (!readWhole(argv[i], whole) || whole.layouts().size() != 3) {
+        WholePlanes whole = wholePlanesOf(argv[i]);
+        if (whole.layouts().size() != 3) {
             std::fprintf(stderr, "%s: can't be read as planes\n", argv[i]);
             return 1;
         }

@@ -1,6 +1,6 @@
 // The stages of the picture path, one picture of 12 megapixels: what each costs, and each kind of vectors.
 
-#include "common/HostFile.h"
+#include "Floor.h"
 #include "imaging/JpegWriter.h"
 #include "imaging/Resample.h"
 #include "support/SamplePhotographs.h"
@@ -29,26 +29,8 @@ const std::filesystem::path& photograph() {
 }
 
 std::unique_ptr<JpegReader> reader() {
-    return std::move(*JpegReader::open(std::move(*PictureInput::open(photograph()))));
+    return readerOf(photograph());
 }
-
-class DroppedPlanes : public PlaneTaker {
-public:
-    void begin(const std::vector<PlaneLayout>& planes) override {
-        m_planes = planes;
-        for (const PlaneLayout& plane : planes)
-            m_rows.emplace_back(static_cast<std::size_t>(plane.rowsAtOnce) * static_cast<std::size_t>(plane.rowBytes));
-    }
-    unsigned char* row(int plane, int y) override {
-        const PlaneLayout& layout = m_planes[static_cast<std::size_t>(plane)];
-        return m_rows[static_cast<std::size_t>(plane)].data() + std::ptrdiff_t{y % layout.rowsAtOnce} * layout.rowBytes;
-    }
-    void rowsReady() override {}
-
-private:
-    std::vector<PlaneLayout> m_planes;
-    std::vector<std::vector<unsigned char>> m_rows;
-};
 
 void decodeToPlanes(benchmark::State& state) {
     for (auto _ : state) {
@@ -64,8 +46,9 @@ void encodeFromPlanes(benchmark::State& state) {
     const auto bytes = scalePictureToJpeg(photograph(), paper, 95);
     const QTemporaryDir folder;
     const std::filesystem::path path = folder.path().toStdString() + "/a.jpg";
-    if (!bytes || !writeWholeFile(path, *bytes))
+    if (!bytes)
         return state.SkipWithError("not made");
+    writeBytes(path, *bytes);
     for (auto _ : state) {
         PictureTimes times;
         if (!scalePictureToJpeg(path, paper, 90, &times))
