@@ -1,6 +1,9 @@
 #include "imaging/ColourPlanes.h"
 
+#include "imaging/PixelRows.h"
+
 #include <algorithm>
+#include <array>
 
 namespace lumora {
 
@@ -35,13 +38,14 @@ void lumaAndChroma(const QRgb* line, int width, unsigned char* y, unsigned char*
 }
 
 void pixelsOf(const unsigned char* y, const unsigned char* cb, const unsigned char* cr, int width, QRgb* line) {
-    for (int x = 0; x < width; ++x) {
+    constexpr std::array<std::int32_t, 4> factors{fixed(1.402), fixed(-0.714136), fixed(-0.344136), fixed(1.772)};
+    for (int x = lumaAndChromaToPixels(y, cb, cr, width, line, factors); x < width; ++x) {
         const int luma = y[x] * one + half;
         const int blue = cb[x] - 128;
         const int red = cr[x] - 128;
-        const int r = (luma + fixed(1.402) * red) >> 16;
-        const int g = (luma + fixed(-0.714136) * red + fixed(-0.344136) * blue) >> 16;
-        const int b = (luma + fixed(1.772) * blue) >> 16;
+        const int r = (luma + factors[0] * red) >> 16;
+        const int g = (luma + factors[1] * red + factors[2] * blue) >> 16;
+        const int b = (luma + factors[3] * blue) >> 16;
         line[x] = qRgb(std::clamp(r, 0, 255), std::clamp(g, 0, 255), std::clamp(b, 0, 255));
     }
 }

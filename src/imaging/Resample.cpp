@@ -2,6 +2,7 @@
 
 #include "imaging/ColourPlanes.h"
 #include "imaging/JpegWriter.h"
+#include "imaging/PixelRows.h"
 #include "imaging/PlaneScaler.h"
 #include "imaging/Stopwatch.h"
 
@@ -161,28 +162,18 @@ Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels&
     for (int i = 0; i < channels; ++i)
         scalers.emplace_back(across, down, 1, source.width(), kernels);
     int next = 0;
-    for (int y = 0; y < source.height(); ++y) {
-        const auto* line = reinterpret_cast<const QRgb*>(source.constScanLine(y));
-        int end = size.height;
-        for (int i = 0; i < channels; ++i) {
-            auto* row = scalers[static_cast<std::size_t>(i)].inputRow(y);
-            for (int x = 0; x < source.width(); ++x)
-                row[x] = static_cast<unsigned char>(line[x] >> (8 * i));
-            scalers[static_cast<std::size_t>(i)].rowsReady(y + 1);
-            end = std::min(end, scalers[static_cast<std::size_t>(i)].outputEnd());
-        }
-        for (; next < end; ++next) {
-            auto* out = reinterpret_cast<QRgb*>(target.scanLine(next));
-            const auto* b = scalers[0].outputRow(next);
-            const auto* g = scalers[1].outputRow(next);
-            const auto* r = scalers[2].outputRow(next);
-            const auto* a = transparent ? scalers[3].outputRow(next) : nullptr;
-            for (int x = 0; x < size.width; ++x) {
-                // The curve overshoots at edges; a colour never lies above its alpha.
-                const int alpha = a != nullptr ? a[x] : 255;
-                out[x] =
-                    qRgba(std::min<int>(r[x], alpha), std::min<int>(g[x], alpha), std::min<int>(b[x], alpha), alpha);
-            }
+    std::vector<std::uint8_t*> rows(scalers.size());
+    for (int y = 0; y < down.source; ++y) {
+        for (std::size_t i = 0; i < rows.size(); ++i)
+            rows[i] = scalers[i].inputRow(y);
+        splitRow(reinterpret_cast<const std::uint32_t*>(source.constScanLine(y)), across.source, rows);
+        for (PlaneScaler& scaler : scalers)
+            scaler.rowsReady(y + 1);
+        for (; next < scalers[0].outputEnd(); ++next) {
+            for (std::size_t i = 0; i < rows.size(); ++i)
+                rows[i] = scalers[i].outputRow(next);
+            // The curve overshoots at edges, so that a colour may come out above its alpha.
+            joinRow(rows, size.width, reinterpret_cast<std::uint32_t*>(target.scanLine(next)));
         }
         for (PlaneScaler& scaler : scalers)
             scaler.release(next);
