@@ -44,12 +44,18 @@ PictureCaption captionOf(const EditFields& edit) {
     return caption;
 }
 
-// The one drawing of preview and print: picture, frame, caption over what the paper shows. A null bitmap is left out.
-void drawEdited(Bitmap& paper, const Bitmap& picture, const Placement& placement, const EditFields& edit,
-                const Bitmap& keyedFrame, const CaptionInk& ink) {
-    drawPlaced(paper, picture, placement, coloursOf(edit));
+// What lies over the picture, in preview and print alike. A null bitmap is left out.
+void drawOver(Bitmap& paper, const Bitmap& keyedFrame, const CaptionInk& ink) {
     drawKeyedFrame(paper, keyedFrame);
     drawInk(paper, ink);
+}
+
+// A part of the picture's own pixels, which have to outlive it.
+Bitmap within(const Bitmap& picture, const QRect& part) {
+    const QImage& image = picture.image();
+    const QRect area = part & image.rect();
+    return Bitmap(QImage(image.constScanLine(area.top()) + std::ptrdiff_t{area.left()} * 4, area.width(), area.height(),
+                         image.bytesPerLine(), image.format()));
 }
 
 PictureSize scaledSize(PictureSize size, double scale) {
@@ -207,7 +213,8 @@ Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>
     placement.panX *= scale;
     placement.panY *= scale;
     Bitmap paper = m_overlay.background;
-    drawEdited(paper, sourceFor(scale), placement, edit, m_overlay.frame, m_overlay.ink);
+    drawPlaced(paper, sourceFor(scale), placement, coloursOf(edit));
+    drawOver(paper, m_overlay.frame, m_overlay.ink);
     return paper;
 }
 
@@ -223,30 +230,40 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
 
     // One decode serves both: what the placed picture needs, and where it leaves paper uncovered, what the stretched
     // one needs.
-    PictureSize wanted{1, 1};
-    if (shows)
-        wanted = reducedSize(*size, placement);
-    if (stretched && !shows)
-        wanted = geometry.size;
-    else if (stretched)
+    PictureSize wanted = shows ? reducedSize(*size, placement) : PictureSize{1, 1};
+    QRect part = shows ? neededPart(wanted, placement, geometry.size) : QRect(0, 0, 1, 1);
+    if (stretched) {
+        if (!shows)
+            wanted = geometry.size;
         wanted = {std::max(wanted.width, std::min(size->width, geometry.size.width)),
                   std::max(wanted.height, std::min(size->height, geometry.size.height))};
-    auto loaded = loadPictureScaled(print.file, wanted);
+        part |= QRect(0, 0, wanted.width, wanted.height);
+    }
+    auto loaded = loadPicturePart(print.file, wanted, part);
     if (!loaded)
         return loaded.failure();
     watch.add(&PictureTimes::decode);
 
-    Bitmap picture = onWhite(*loaded);
+    Bitmap& picture = *loaded;
+    if (picture.image().format() != QImage::Format_RGB32)
+        picture = onWhite(picture);
     if (edit.ToneFlag == 1 && print.source == EditedPrint::Source::AsItIs)
-        picture = ColourMatrix::grey(greyWeight).applied(picture);
-    Bitmap paper = stretched ? resampled(picture, geometry.size)
+        ColourMatrix::grey(greyWeight).apply(picture);
+    const Bitmap whole = within(picture, QRect(-part.topLeft(), QSize(wanted.width, wanted.height)));
+    Bitmap paper = stretched ? resampled(whole, geometry.size)
                              : Bitmap(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
     if (paper.isNull())
         return noRoom(print.file, geometry.size);
+    if (shows && wanted == reducedSize(*size, placement)) {
+        coloursOf(edit).apply(picture);
+        drawPlacedPart(paper, picture, part, wanted, placement);
+    } else if (shows) {
+        drawPlaced(paper, whole, placement, coloursOf(edit));
+    }
     const auto frame = loadFrame(print.framesFolder, edit, FrameUse::Print);
-    drawEdited(paper, shows ? picture : Bitmap(), placement, edit, frame ? keyedFrame(*frame, geometry.size) : Bitmap(),
-               edit.TextOn == 1 ? inkOf(captionOf(edit), geometry.size, {geometry.scaleX, geometry.scaleY})
-                                : CaptionInk());
+    drawOver(paper, frame ? keyedFrame(*frame, geometry.size) : Bitmap(),
+             edit.TextOn == 1 ? inkOf(captionOf(edit), geometry.size, {geometry.scaleX, geometry.scaleY})
+                              : CaptionInk());
     watch.add(&PictureTimes::draw);
     return paper;
 }

@@ -38,13 +38,19 @@ bool ColourMatrix::changesNothing() const {
 
 Bitmap ColourMatrix::applied(const Bitmap& picture) const {
     Bitmap result(picture.image().convertToFormat(QImage::Format_RGB32));
-    if (!changesNothing()) {
-        for (int y = 0; y < result.height(); ++y) {
-            auto* row = reinterpret_cast<std::uint32_t*>(result.image().scanLine(y));
-            applyMatrixToRow(*this, row, row, result.width());
-        }
-    }
+    apply(result);
     return result;
+}
+
+void ColourMatrix::apply(Bitmap& picture) const {
+    if (changesNothing())
+        return;
+    const int height = picture.height();
+    const int width = picture.width();
+    for (int y = 0; y < height; ++y) {
+        auto* row = reinterpret_cast<std::uint32_t*>(picture.image().scanLine(y));
+        applyMatrixToRow(*this, row, row, width);
+    }
 }
 
 } // namespace lumora

@@ -26,6 +26,8 @@ public:
     float entry(int row, int column) const { return m_entries[static_cast<std::size_t>(row * 3 + column)]; }
 
     Bitmap applied(const Bitmap& picture) const;
+    // In place; the picture has no transparency.
+    void apply(Bitmap& picture) const;
 
 private:
     std::array<float, 9> m_entries;

@@ -24,7 +24,18 @@ Failure memoryIsShort(const std::filesystem::path& path) {
     return pictureFailure(path, Failure::Kind::TooLarge, QStringLiteral("memory is short"));
 }
 
-using SizeRule = std::function<PictureSize(PictureSize)>;
+struct Wanted {
+    PictureSize size;
+    QRect part;
+
+    explicit Wanted(PictureSize whole)
+        : size(whole)
+        , part(0, 0, whole.width, whole.height) {}
+    Wanted(PictureSize whole, const QRect& some)
+        : size(whole)
+        , part(some) {}
+};
+using SizeRule = std::function<Wanted(PictureSize)>;
 
 Result<Bitmap> loadScaled(const std::filesystem::path& path, const SizeRule& wantedFor) try {
     auto input = PictureInput::open(path);
@@ -32,12 +43,16 @@ Result<Bitmap> loadScaled(const std::filesystem::path& path, const SizeRule& wan
         return input.failure();
     if (input->format() == PictureInput::Format::Jpeg) {
         auto reader = JpegReader::open(std::move(*input));
-        return reader ? readResampled(**reader, wantedFor((*reader)->size())) : reader.failure();
+        if (!reader)
+            return reader.failure();
+        const Wanted wanted = wantedFor((*reader)->size());
+        return readResampledPart(**reader, wanted.size, wanted.part);
     }
     auto whole = readOtherPicture(*input);
     if (!whole)
         return whole.failure();
-    Bitmap scaled = resampled(*whole, wantedFor({whole->width(), whole->height()}));
+    const Wanted wanted = wantedFor({whole->width(), whole->height()});
+    Bitmap scaled = resampledPart(*whole, wanted.size, wanted.part);
     if (scaled.isNull())
         return memoryIsShort(path);
     return scaled;
@@ -74,7 +89,15 @@ Result<Bitmap> loadPicture(const std::filesystem::path& path) {
 Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize size) {
     if (auto bounds = checkPictureBounds(path, size.width, size.height); !bounds)
         return bounds.failure();
-    return loadScaled(path, [size](PictureSize) { return size; });
+    return loadScaled(path, [size](PictureSize) { return Wanted(size); });
+}
+
+Result<Bitmap> loadPicturePart(const std::filesystem::path& path, PictureSize size, const QRect& part) {
+    if (auto bounds = checkPictureBounds(path, size.width, size.height); !bounds)
+        return bounds.failure();
+    if (auto bounds = checkPictureBounds(path, part.width(), part.height()); !bounds)
+        return bounds.failure();
+    return loadScaled(path, [&](PictureSize) { return Wanted(size, part); });
 }
 
 PictureSize smallPictureSize(PictureSize picture, int cell) {
@@ -90,7 +113,8 @@ std::vector<Result<Bitmap>> loadSmallPictures(const std::vector<std::filesystem:
     std::atomic<std::size_t> next{0};
     const auto work = [&] {
         for (std::size_t i = next++; i < paths.size(); i = next++) {
-            loaded[i].emplace(loadScaled(paths[i], [cell](PictureSize size) { return smallPictureSize(size, cell); }));
+            loaded[i].emplace(
+                loadScaled(paths[i], [cell](PictureSize size) { return Wanted(smallPictureSize(size, cell)); }));
         }
     };
     {

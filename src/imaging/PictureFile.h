@@ -4,6 +4,7 @@
 #include "imaging/Bitmap.h"
 
 #include <QByteArray>
+#include <QRect>
 
 #include <filesystem>
 #include <vector>
@@ -37,6 +38,9 @@ Result<Bitmap> loadPicture(const std::filesystem::path& path);
 // The picture shrunk smoothly to exactly size (the caller keeps the proportions), by a scaled decode where that loses
 // nothing; enlarged smoothly where size is larger.
 Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize size);
+
+// The part of it that is needed. The part may reach beyond the picture, whose edge is repeated there.
+Result<Bitmap> loadPicturePart(const std::filesystem::path& path, PictureSize size, const QRect& part);
 
 // The size of the small picture in a cell: the longer side fills the cell, the other follows the proportion, at
 // least 1.

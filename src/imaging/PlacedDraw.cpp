@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstring>
+#include <memory>
 #include <numbers>
 #include <utility>
 #include <vector>
@@ -67,15 +68,17 @@ std::pair<int, int> narrowed(std::pair<int, int> range, double start, double ste
     return {std::max(range.first, held(std::ceil(first - 1e-9))), std::min(range.second, held(std::ceil(last - 1e-9)))};
 }
 
+// How far samples reach beyond the picture's edge, and a little more.
+constexpr int margin = 6;
+
 // The toned part of the source that the paper can show, with its edges repeated.
 class PreparedSource {
 public:
-    static constexpr int margin = 6;
-
     PreparedSource(const Bitmap& source, QRect wanted, const ColourMatrix& matrix)
         : m_area(wanted)
         , m_stride(wanted.width() + 2 * margin)
-        , m_pixels(static_cast<std::size_t>(m_stride) * static_cast<std::size_t>(wanted.height() + 2 * margin)) {
+        , m_pixels(std::make_unique_for_overwrite<std::uint32_t[]>(
+              static_cast<std::size_t>(m_stride) * static_cast<std::size_t>(wanted.height() + 2 * margin))) {
         const bool toned = !matrix.changesNothing();
         for (int y = 0; y < wanted.height(); ++y) {
             const auto* from =
@@ -95,18 +98,17 @@ public:
     }
 
     PaddedPicture padded() const { return {rowOf(0), m_stride}; }
-    int left() const { return m_area.left(); }
-    int top() const { return m_area.top(); }
+    QPoint corner() const { return m_area.topLeft(); }
 
 private:
-    std::uint32_t* rowOf(int y) { return m_pixels.data() + (std::ptrdiff_t(y) + margin) * m_stride + margin; }
+    std::uint32_t* rowOf(int y) { return m_pixels.get() + (std::ptrdiff_t(y) + margin) * m_stride + margin; }
     const std::uint32_t* rowOf(int y) const {
-        return m_pixels.data() + (std::ptrdiff_t(y) + margin) * m_stride + margin;
+        return m_pixels.get() + (std::ptrdiff_t(y) + margin) * m_stride + margin;
     }
 
     QRect m_area;
     std::ptrdiff_t m_stride;
-    std::vector<std::uint32_t> m_pixels;
+    std::unique_ptr<std::uint32_t[]> m_pixels;
 };
 
 std::uint32_t blended(std::uint32_t below, std::uint32_t above, double coverage) {
@@ -120,8 +122,12 @@ std::uint32_t blended(std::uint32_t below, std::uint32_t above, double coverage)
     return result;
 }
 
-// Source rows and columns that samples for this paper can touch.
-QRect touched(const Inverse& inverse, PictureSize paper, double scaleX, double scaleY, PictureSize source) {
+// Source rows and columns that samples for this paper can touch, beyond lets them pass the source's edge.
+QRect touched(const Placement& placement, PictureSize paper, PictureSize source, int beyond) {
+    const PictureSize zoomed = placement.zoomed();
+    const Inverse inverse(placement, zoomed);
+    const double scaleX = double(source.width) / zoomed.width;
+    const double scaleY = double(source.height) / zoomed.height;
     double left = 1e9;
     double top = 1e9;
     double right = -1e9;
@@ -136,13 +142,72 @@ QRect touched(const Inverse& inverse, PictureSize paper, double scaleX, double s
             bottom = std::max(bottom, v);
         }
     }
-    const auto held = [](double value, int limit) { return static_cast<int>(std::clamp(value, 0.0, double(limit))); };
-    const int reach = 4;
-    const int x0 = std::min(held(left - reach, source.width), source.width - 1);
-    const int y0 = std::min(held(top - reach, source.height), source.height - 1);
-    const int x1 = std::max(held(right + reach, source.width), x0 + 1);
-    const int y1 = std::max(held(bottom + reach, source.height), y0 + 1);
+    constexpr int reach = 4;
+    const auto held = [beyond](double value, int limit) {
+        return static_cast<int>(std::clamp<double>(value, -beyond, limit + beyond));
+    };
+    const int x0 = std::min(held(std::floor(left) - reach, source.width), source.width - 1);
+    const int y0 = std::min(held(std::floor(top) - reach, source.height), source.height - 1);
+    const int x1 = std::max(held(std::ceil(right) + reach, source.width), x0 + 1);
+    const int y1 = std::max(held(std::ceil(bottom) + reach, source.height), y0 + 1);
     return {x0, y0, x1 - x0, y1 - y0};
+}
+
+// padded: its first pixel is the pixel corner of a picture of the size whole.
+void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, PictureSize whole,
+                 const Placement& placement) {
+    const PictureSize zoomed = placement.zoomed();
+    const PictureSize size{paper.width(), paper.height()};
+    const Inverse inverse(placement, zoomed);
+    const double scaleX = double(whole.width) / zoomed.width;
+    const double scaleY = double(whole.height) / zoomed.height;
+
+    const auto fixed = [](double value) { return static_cast<std::int64_t>(std::llround(value * 4294967296.0)); };
+    const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
+    const double stepU = inverse.turn.cosine;
+    const double stepV = -inverse.turn.sine;
+    const double outer = level ? 0.0 : 0.5; // how far coverage reaches past the edge
+    std::vector<std::uint32_t> samples(static_cast<std::size_t>(size.width));
+
+    for (int y = 0; y < size.height; ++y) {
+        const double startU = inverse.u(0, y + 0.5);
+        const double startV = inverse.v(0, y + 0.5);
+        const auto inside = [&](double edge) {
+            auto range = narrowed({0, size.width}, startU, stepU, -edge, zoomed.width + edge);
+            return narrowed(range, startV, stepV, -edge, zoomed.height + edge);
+        };
+        const auto [from, to] = inside(outer);
+        if (from >= to)
+            continue;
+        auto [solidFrom, solidTo] = inside(-outer);
+        if (solidFrom >= solidTo)
+            solidFrom = solidTo = to;
+
+        const double u = startU + stepU * (from + 0.5);
+        const double v = startV + stepV * (from + 0.5);
+        // Half a phase of the sampler's weights, which cut the position.
+        const double half = 1.0 / 512.0;
+        const SampleLine line{fixed(u * scaleX - 0.5 - corner.x() + half), fixed(v * scaleY - 0.5 - corner.y() + half),
+                              fixed(stepU * scaleX), fixed(stepV * scaleY)};
+        auto* row = reinterpret_cast<std::uint32_t*>(paper.image().scanLine(y));
+        if (solidFrom == from && solidTo == to) {
+            sampleLine(padded, line, row + from, to - from);
+            continue;
+        }
+        sampleLine(padded, line, samples.data(), to - from);
+        for (int x = from; x < to; ++x) {
+            const std::uint32_t sample = samples[static_cast<std::size_t>(x - from)];
+            if (x >= solidFrom && x < solidTo) {
+                row[x] = sample;
+                continue;
+            }
+            const double atU = startU + stepU * (x + 0.5);
+            const double atV = startV + stepV * (x + 0.5);
+            const double coverage = std::clamp(std::min(atU, zoomed.width - atU) + 0.5, 0.0, 1.0) *
+                                    std::clamp(std::min(atV, zoomed.height - atV) + 0.5, 0.0, 1.0);
+            row[x] = blended(row[x], sample, coverage);
+        }
+    }
 }
 
 } // namespace
@@ -195,62 +260,23 @@ void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement,
     if (plain.image().format() != QImage::Format_RGB32)
         plain = Bitmap(plain.image().convertToFormat(QImage::Format_RGB32));
 
-    const PictureSize zoomed = placement.zoomed();
     const PictureSize size{paper.width(), paper.height()};
-    const Inverse inverse(placement, zoomed);
-    const double scaleX = double(plain.width()) / zoomed.width;
-    const double scaleY = double(plain.height()) / zoomed.height;
-    const PreparedSource prepared(plain, touched(inverse, size, scaleX, scaleY, {plain.width(), plain.height()}),
-                                  matrix);
-    const PaddedPicture padded = prepared.padded();
+    const PictureSize whole{plain.width(), plain.height()};
+    const PreparedSource prepared(plain, touched(placement, size, whole, 0), matrix);
+    drawSamples(paper, prepared.padded(), prepared.corner(), whole, placement);
+}
 
-    const auto fixed = [](double value) { return static_cast<std::int64_t>(std::llround(value * 4294967296.0)); };
-    const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
-    const double stepU = inverse.turn.cosine;
-    const double stepV = -inverse.turn.sine;
-    const double outer = level ? 0.0 : 0.5; // how far coverage reaches past the edge
-    std::vector<std::uint32_t> samples(static_cast<std::size_t>(size.width));
+QRect neededPart(PictureSize reduced, const Placement& placement, PictureSize paper) {
+    return touched(placement, paper, reduced, margin);
+}
 
-    for (int y = 0; y < size.height; ++y) {
-        const double startU = inverse.u(0, y + 0.5);
-        const double startV = inverse.v(0, y + 0.5);
-        const auto inside = [&](double edge) {
-            auto range = narrowed({0, size.width}, startU, stepU, -edge, zoomed.width + edge);
-            return narrowed(range, startV, stepV, -edge, zoomed.height + edge);
-        };
-        const auto [from, to] = inside(outer);
-        if (from >= to)
-            continue;
-        auto [solidFrom, solidTo] = inside(-outer);
-        if (solidFrom >= solidTo)
-            solidFrom = solidTo = to;
-
-        const double u = startU + stepU * (from + 0.5);
-        const double v = startV + stepV * (from + 0.5);
-        // Half a phase of the sampler's weights, which cut the position.
-        const double half = 1.0 / 512.0;
-        const SampleLine line{fixed(u * scaleX - 0.5 - prepared.left() + half),
-                              fixed(v * scaleY - 0.5 - prepared.top() + half), fixed(stepU * scaleX),
-                              fixed(stepV * scaleY)};
-        auto* row = reinterpret_cast<std::uint32_t*>(paper.image().scanLine(y));
-        if (solidFrom == from && solidTo == to) {
-            sampleLine(padded, line, row + from, to - from);
-            continue;
-        }
-        sampleLine(padded, line, samples.data(), to - from);
-        for (int x = from; x < to; ++x) {
-            const std::uint32_t sample = samples[static_cast<std::size_t>(x - from)];
-            if (x >= solidFrom && x < solidTo) {
-                row[x] = sample;
-                continue;
-            }
-            const double atU = startU + stepU * (x + 0.5);
-            const double atV = startV + stepV * (x + 0.5);
-            const double coverage = std::clamp(std::min(atU, zoomed.width - atU) + 0.5, 0.0, 1.0) *
-                                    std::clamp(std::min(atV, zoomed.height - atV) + 0.5, 0.0, 1.0);
-            row[x] = blended(row[x], sample, coverage);
-        }
-    }
+void drawPlacedPart(Bitmap& paper, const Bitmap& pixels, const QRect& part, PictureSize reduced,
+                    const Placement& placement) {
+    if (paper.isNull() || pixels.isNull())
+        return;
+    const PaddedPicture padded{reinterpret_cast<const std::uint32_t*>(pixels.image().constBits()),
+                               pixels.image().bytesPerLine() / std::ptrdiff_t{sizeof(std::uint32_t)}};
+    drawSamples(paper, padded, part.topLeft(), reduced, placement);
 }
 
 Bitmap keyedFrame(const Bitmap& frame, PictureSize paper) {

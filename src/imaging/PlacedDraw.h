@@ -46,6 +46,15 @@ PictureSize reducedSize(PictureSize source, const Placement& placement);
 // larger than reducedSize() is reduced first.
 void drawPlaced(Bitmap& paper, const Bitmap& source, const Placement& placement, const ColourMatrix& matrix);
 
+// The part of a source, reduced to this size, that drawing on this paper touches; beyond the source its edge is
+// repeated. Empty where the picture lies off the paper.
+QRect neededPart(PictureSize reduced, const Placement& placement, PictureSize paper);
+
+// The same drawing from that part (or a larger one) of the reduced source, its colours done and its format 32 bits
+// without alpha.
+void drawPlacedPart(Bitmap& paper, const Bitmap& pixels, const QRect& part, PictureSize reduced,
+                    const Placement& placement);
+
 // A frame stretched to the size of the paper: alpha = min(255, 11 * (red + green + blue)), so that black is
 // transparent; the alpha is taken before the stretching, and colours are weighted by it. Null where memory is short.
 Bitmap keyedFrame(const Bitmap& frame, PictureSize paper);

@@ -47,18 +47,18 @@ std::vector<int> rounded(const std::vector<double>& exact) {
 
 } // namespace
 
-CubicWeights CubicWeights::make(int sourceCount, int targetCount, double step) {
-    const double widened = std::max(1.0, step);
-    std::vector<std::vector<int>> all(static_cast<std::size_t>(targetCount));
+CubicWeights CubicWeights::make(const PlaneAxis& axis) {
+    const double widened = std::max(1.0, axis.step);
+    std::vector<std::vector<int>> all(static_cast<std::size_t>(axis.target));
     CubicWeights result;
     result.first.resize(all.size());
     std::vector<double> exact;
-    for (int i = 0; i < targetCount; ++i) {
-        const double centre = (i + 0.5) * step - 0.5;
+    for (int i = 0; i < axis.target; ++i) {
+        const double centre = (axis.first + i + 0.5) * axis.step - 0.5;
         const int low = static_cast<int>(std::floor(centre - 2 * widened)) + 1;
         const int high = static_cast<int>(std::ceil(centre + 2 * widened)) - 1;
-        const int first = std::clamp(low, 0, sourceCount - 1);
-        const int last = std::clamp(high, 0, sourceCount - 1);
+        const int first = std::clamp(low, 0, axis.source - 1);
+        const int last = std::clamp(high, 0, axis.source - 1);
         exact.assign(static_cast<std::size_t>(last - first) + 1, 0.0);
         for (int k = low; k <= high; ++k)
             exact[static_cast<std::size_t>(std::clamp(k, first, last) - first)] += cubic((k - centre) / widened);
@@ -86,7 +86,7 @@ PlaneScaler::PlaneScaler(PlaneAxis across, PlaneAxis down, int rowsAtOnce, int r
     : m_kernels(kernels)
     , m_across(across)
     , m_down(down)
-    , m_rowWeights(CubicWeights::make(down.source, down.target, down.step))
+    , m_rowWeights(CubicWeights::make(down))
     , m_outputCount(roundedUp(across.target, 8))
     , m_inputRows(m_rowWeights.taps + rowsAtOnce)
     , m_inputStride(roundedUp(std::max(rowBytes, across.source), 64) + ResampleKernels::slack)
@@ -96,14 +96,17 @@ PlaneScaler::PlaneScaler(PlaneAxis across, PlaneAxis down, int rowsAtOnce, int r
     , m_blended(ResampleKernels::rows * static_cast<std::size_t>(m_blendedStride))
     , m_columns([&] {
         // Taps of a row begin at an even sample, since columns are packed in pairs.
-        const CubicWeights weights = CubicWeights::make(across.source, across.target, across.step);
+        const CubicWeights weights = CubicWeights::make(across);
+        const auto [lowest, highest] = std::minmax_element(weights.first.begin(), weights.first.end());
+        m_columnBegin = *lowest / 2 * 2;
+        m_columnCount = std::min(across.source, *highest + weights.taps) - m_columnBegin;
         m_pairs = (weights.taps + 2) / 2;
         m_pairWeights.assign(static_cast<std::size_t>(m_outputCount) * static_cast<std::size_t>(m_pairs) * 2, 0);
         m_firstPair.resize(static_cast<std::size_t>(m_outputCount));
         for (int i = 0; i < m_outputCount; ++i) {
             const int from = std::min(i, across.target - 1);
             const int first = weights.first[static_cast<std::size_t>(from)];
-            m_firstPair[static_cast<std::size_t>(i)] = first / 2;
+            m_firstPair[static_cast<std::size_t>(i)] = (first - m_columnBegin) / 2;
             std::copy_n(weights.weights.begin() + std::ptrdiff_t{from} * weights.taps, weights.taps,
                         m_pairWeights.begin() + std::ptrdiff_t{i} * m_pairs * 2 + first % 2);
         }
@@ -139,8 +142,8 @@ void PlaneScaler::rowsReady(int end) {
             return;
         // Where the weight is 0 any row serves.
         for (int k = 0; k < taps; ++k)
-            m_taps[static_cast<std::size_t>(k)] = inputRow(first + std::min(k, used - 1));
-        m_kernels.blendRows(m_taps.data(), weights, used + used % 2, m_across.source,
+            m_taps[static_cast<std::size_t>(k)] = inputRow(first + std::min(k, used - 1)) + m_columnBegin;
+        m_kernels.blendRows(m_taps.data(), weights, used + used % 2, m_columnCount,
                             m_blended.data() + m_blendedRows * m_blendedStride);
         if (++m_blendedRows == ResampleKernels::rows)
             finishBlock(ResampleKernels::rows);
@@ -155,7 +158,7 @@ void PlaneScaler::finishBlock(int rows) {
         static_cast<std::size_t>(held + ResampleKernels::rows) * static_cast<std::size_t>(m_outputStride);
     if (m_output.size() < needed)
         m_output.resize(needed);
-    m_kernels.packColumns(m_blended.data(), m_blendedStride, m_across.source, m_columns.data());
+    m_kernels.packColumns(m_blended.data(), m_blendedStride, m_columnCount, m_columns.data());
     m_kernels.blendColumns(m_columns.data(), m_firstPair.data(), m_pairWeights.data(), m_pairs, m_outputCount,
                            m_output.data() + held * m_outputStride, m_outputStride);
     m_outputEnd += rows;

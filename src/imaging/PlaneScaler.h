@@ -10,6 +10,14 @@
 
 namespace lumora {
 
+// One direction of a plane.
+struct PlaneAxis {
+    int source = 0; // samples that carry the picture, without padding
+    int target = 0;
+    double step = 1; // distance of two target samples in source samples
+    int first = 0;   // where the first target sample stands; it and the last may lie beyond the source
+};
+
 // Weights of an antialiased bicubic (a = -0.5, the kernel widened by the shrink): 14 fraction bits, and the weights of
 // a target sample sum to exactly 16384, so that a flat picture stays flat to the last bit. Beyond its ends the source
 // repeats its edge.
@@ -18,8 +26,8 @@ struct CubicWeights {
     std::vector<std::int32_t> first;   // source sample of the first weight
     std::vector<std::int16_t> weights; // taps for each target sample
 
-    // step is the distance of two target samples in source samples. The centre of sample k lies at k + 0.5 in both.
-    static CubicWeights make(int sourceCount, int targetCount, double step);
+    // The centre of sample k lies at k + 0.5 in source and target.
+    static CubicWeights make(const PlaneAxis& axis);
 };
 
 // Zeroed memory for samples, aligned for vector loads.
@@ -39,13 +47,6 @@ private:
         void operator()(Sample* data) const { ::operator delete(data, alignment); }
     };
     std::unique_ptr<Sample, Free> m_data;
-};
-
-// One direction of a plane.
-struct PlaneAxis {
-    int source = 0; // samples that carry the picture, without padding
-    int target = 0;
-    double step = 1; // distance of two target samples in source samples
 };
 
 // Scales one plane of bytes while its rows come in from the top; holds only the rows that are still needed.
@@ -75,6 +76,8 @@ private:
     PlaneAxis m_down;
 
     CubicWeights m_rowWeights;
+    int m_columnBegin = 0; // the source columns that carry weight
+    int m_columnCount = 0;
     std::vector<std::int32_t> m_firstPair;
     std::vector<std::int16_t> m_pairWeights;
     int m_pairs = 0;

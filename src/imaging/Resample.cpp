@@ -13,17 +13,23 @@ namespace lumora {
 
 namespace {
 
-PlaneAxis axis(int samples, double pitch, int sourceSize, int targetSize, int targetPitch) {
-    const double step = static_cast<double>(targetPitch) * sourceSize / targetSize / pitch;
-    return {samples, (targetSize + targetPitch - 1) / targetPitch, step};
+QRect wholeOf(PictureSize size) {
+    return {0, 0, size.width, size.height};
+}
+
+double stepOf(double pitch, int sourceSize, int targetSize, int targetPitch) {
+    return static_cast<double>(targetPitch) * sourceSize / targetSize / pitch;
 }
 
 // A scaler for each plane; what becomes of the rows is for those who derive from it.
 class ScalingTaker : public PlaneTaker {
 public:
-    ScalingTaker(PictureSize source, PictureSize target, int chromaPitch, const ResampleKernels& kernels)
+    // part of the target; where chroma is coarser it has to be the whole.
+    ScalingTaker(PictureSize source, PictureSize target, const QRect& part, int chromaPitch,
+                 const ResampleKernels& kernels)
         : m_source(source)
         , m_target(target)
+        , m_part(part)
         , m_chromaPitch(chromaPitch)
         , m_kernels(kernels) {}
 
@@ -33,9 +39,11 @@ public:
         m_scalers.reserve(planes.size());
         for (const PlaneLayout& plane : planes) {
             const int pitch = m_scalers.empty() ? 1 : m_chromaPitch;
-            m_scalers.emplace_back(axis(plane.width, plane.pitchX, m_source.width, m_target.width, pitch),
-                                   axis(plane.height, plane.pitchY, m_source.height, m_target.height, pitch),
-                                   plane.rowsAtOnce, plane.rowBytes, m_kernels);
+            const PlaneAxis across{plane.width, (m_part.width() + pitch - 1) / pitch,
+                                   stepOf(plane.pitchX, m_source.width, m_target.width, pitch), m_part.left()};
+            const PlaneAxis down{plane.height, (m_part.height() + pitch - 1) / pitch,
+                                 stepOf(plane.pitchY, m_source.height, m_target.height, pitch), m_part.top()};
+            m_scalers.emplace_back(across, down, plane.rowsAtOnce, plane.rowBytes, m_kernels);
         }
     }
     unsigned char* row(int plane, int y) override { return m_scalers[static_cast<std::size_t>(plane)].inputRow(y); }
@@ -51,11 +59,12 @@ protected:
     // More rows of each of scalers() may be ready; the last call comes when all are.
     virtual void rowsScaled() = 0;
     std::vector<PlaneScaler>& scalers() { return m_scalers; }
-    PictureSize target() const { return m_target; }
+    QRect part() const { return m_part; }
 
 private:
     PictureSize m_source;
     PictureSize m_target;
+    QRect m_part;
     int m_chromaPitch;
     const ResampleKernels& m_kernels;
     std::vector<PlaneLayout> m_planes;
@@ -65,20 +74,20 @@ private:
 
 class BitmapTaker : public ScalingTaker {
 public:
-    BitmapTaker(PictureSize source, Bitmap& target, const ResampleKernels& kernels)
-        : ScalingTaker(source, {target.width(), target.height()}, 1, kernels)
+    BitmapTaker(PictureSize source, PictureSize size, const QRect& part, Bitmap& target, const ResampleKernels& kernels)
+        : ScalingTaker(source, size, part, 1, kernels)
         , m_bitmap(target)
         , m_neutral(static_cast<std::size_t>(target.width()), 128) {}
 
 private:
     void rowsScaled() override {
-        int end = target().height;
+        int end = part().height();
         for (const PlaneScaler& scaler : scalers())
             end = std::min(end, scaler.outputEnd());
         const bool grey = scalers().size() < 3;
         for (; m_next < end; ++m_next) {
             pixelsOf(scalers()[0].outputRow(m_next), grey ? m_neutral.data() : scalers()[1].outputRow(m_next),
-                     grey ? m_neutral.data() : scalers()[2].outputRow(m_next), target().width,
+                     grey ? m_neutral.data() : scalers()[2].outputRow(m_next), part().width(),
                      reinterpret_cast<QRgb*>(m_bitmap.image().scanLine(m_next)));
         }
         for (PlaneScaler& scaler : scalers())
@@ -94,7 +103,7 @@ class JpegTaker : public ScalingTaker {
 public:
     JpegTaker(PictureSize source, PictureSize target, JpegWriter& writer, const ResampleKernels& kernels,
               Stopwatch& watch)
-        : ScalingTaker(source, target, 2, kernels)
+        : ScalingTaker(source, target, wholeOf(target), 2, kernels)
         , m_writer(writer)
         , m_watch(watch)
         , m_neutral(static_cast<std::size_t>(target.width) / 2 + ResampleKernels::slack, 128) {}
@@ -107,7 +116,7 @@ public:
 
 private:
     void rowsScaled() override {
-        const int height = target().height;
+        const int height = part().height();
         while (m_next < height) {
             const int chroma = m_next / 2;
             if (scalers()[0].outputEnd() < std::min(m_next + JpegWriter::lumaRows, height))
@@ -145,17 +154,21 @@ private:
 } // namespace
 
 Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels) {
-    if (picture.isNull() || size.width < 1 || size.height < 1)
+    return resampledPart(picture, size, wholeOf(size), kernels);
+}
+
+Bitmap resampledPart(const Bitmap& picture, PictureSize size, const QRect& part, const ResampleKernels& kernels) {
+    if (picture.isNull() || size.width < 1 || size.height < 1 || part.isEmpty())
         return {};
     const bool transparent = picture.image().hasAlphaChannel();
     const QImage source =
         picture.image().convertToFormat(transparent ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
-    QImage target(size.width, size.height, source.format());
+    QImage target(part.size(), source.format());
     if (source.isNull() || target.isNull())
         return {};
 
-    const PlaneAxis across = axis(source.width(), 1, source.width(), size.width, 1);
-    const PlaneAxis down = axis(source.height(), 1, source.height(), size.height, 1);
+    const PlaneAxis across{source.width(), part.width(), stepOf(1, source.width(), size.width, 1), part.left()};
+    const PlaneAxis down{source.height(), part.height(), stepOf(1, source.height(), size.height, 1), part.top()};
     const int channels = transparent ? 4 : 3;
     std::vector<PlaneScaler> scalers;
     scalers.reserve(4);
@@ -173,7 +186,7 @@ Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels&
             for (std::size_t i = 0; i < rows.size(); ++i)
                 rows[i] = scalers[i].outputRow(next);
             // The curve overshoots at edges, so that a colour may come out above its alpha.
-            joinRow(rows, size.width, reinterpret_cast<std::uint32_t*>(target.scanLine(next)));
+            joinRow(rows, part.width(), reinterpret_cast<std::uint32_t*>(target.scanLine(next)));
         }
         for (PlaneScaler& scaler : scalers)
             scaler.release(next);
@@ -190,15 +203,20 @@ int decodeDenominator(PictureSize source, PictureSize wanted) {
 }
 
 Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels) {
+    return readResampledPart(reader, size, wholeOf(size), kernels);
+}
+
+Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRect& part,
+                                 const ResampleKernels& kernels) {
     const int denominator = decodeDenominator(reader.size(), size);
     if (!reader.hasPlanes()) {
         auto whole = reader.readBitmap(denominator);
-        return whole ? Result<Bitmap>(resampled(*whole, size, kernels)) : whole;
+        return whole ? Result<Bitmap>(resampledPart(*whole, size, part, kernels)) : whole;
     }
-    Bitmap target(size.width, size.height, Qt::white);
+    Bitmap target(QImage(part.size(), QImage::Format_RGB32));
     if (target.isNull())
         return Failure{Failure::Kind::TooLarge, QStringLiteral("memory is short")};
-    BitmapTaker taker(reader.size(), target, kernels);
+    BitmapTaker taker(reader.size(), size, part, target, kernels);
     if (auto read = reader.readPlanes(denominator, taker); !read)
         return read.failure();
     return target;

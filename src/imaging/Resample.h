@@ -7,6 +7,7 @@
 #include "imaging/ResampleKernels.h"
 
 #include <QByteArray>
+#include <QRect>
 
 // Scaling by the antialiased bicubic of PlaneScaler. Pixel centres lie at k + 0.5, the source repeats its edge, a flat
 // picture stays flat to the last bit.
@@ -15,6 +16,10 @@ namespace lumora {
 // Null when the picture is, when a side of size is under 1, or when memory is short.
 Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels = bestKernels());
 
+// A part of the picture so scaled. It may reach beyond the picture, whose edge is repeated there.
+Bitmap resampledPart(const Bitmap& picture, PictureSize size, const QRect& part,
+                     const ResampleKernels& kernels = bestKernels());
+
 // The strongest scaled decode (1, 2, 4 or 8) that still leaves at least twice the pixels wanted: nearer than that,
 // quality suffers.
 int decodeDenominator(PictureSize source, PictureSize wanted);
@@ -22,6 +27,8 @@ int decodeDenominator(PictureSize source, PictureSize wanted);
 // The reader's picture in size; from plane to plane, without whole pixels, where the file allows it. The reader is used
 // up.
 Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels = bestKernels());
+Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRect& part,
+                                 const ResampleKernels& kernels = bestKernels());
 Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
                                        const ResampleKernels& kernels = bestKernels(), PictureTimes* times = nullptr);
 

@@ -28,7 +28,7 @@ ReferencePlane lumaOf(const Bitmap& picture) {
 TEST(ResampleTest, theWeightsOfEverySampleSumToExactlyOne) {
     for (const double step : {0.3, 0.5, 1.0, 1.37, 2.0, 20.0 / 9, 7.77, 100.0}) {
         const int count = static_cast<int>(500 / step);
-        const CubicWeights weights = CubicWeights::make(500, count, step);
+        const CubicWeights weights = CubicWeights::make({500, count, step});
         for (int i = 0; i < count; ++i) {
             const auto begin = weights.weights.begin() + std::ptrdiff_t{i} * weights.taps;
             EXPECT_EQ(std::accumulate(begin, begin + weights.taps, 0), 16384) << step << " at " << i;
