@@ -7,6 +7,7 @@
 #include "editing/RedI.h"
 #include "editing/gdisave.h"
 #include "editing/mikledet.h"
+#include "editing/tFrmNew.h"
 #include "entry/Havharot.h"
 #include "entry/nnn.h"
 #include "platform/Platform.h"
@@ -26,6 +27,7 @@
 #include "views/kyoskNewView.h"
 #include "views/mikledetView.h"
 #include "views/nnnView.h"
+#include "views/tFrmNewView.h"
 
 namespace lumora {
 
@@ -36,6 +38,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::Havharot, [&] { return std::make_unique<Havharot>(state, platform, chain); });
     chain.registerPage(PageId::kyoskNew, [&] { return std::make_unique<kyoskNew>(state, platform, chain); });
     chain.registerPage(PageId::gdisave, [&] { return std::make_unique<gdisave>(state, platform, chain); });
+    chain.registerPage(PageId::tFrmNew, [&] { return std::make_unique<tFrmNew>(state, platform, chain); });
     chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
     chain.registerPage(PageId::Form3, [&] { return std::make_unique<Form3>(state, platform, chain); });
     chain.registerPage(PageId::RedI, [&] { return std::make_unique<RedI>(state, platform, chain); });
@@ -46,7 +49,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
 }
 
-void registerViews(MainWindow& window, SessionState& state, const Files& files) {
+void registerViews(MainWindow& window, PageChain& chain, SessionState& state, const Files& files) {
     // A view is made for the page that its id stands for, so the page is of that class.
     window.registerView(PageId::hatchala, [&](Page& page, const Theme& theme) {
         return std::make_unique<hatchalaView>(static_cast<hatchala&>(page), state, theme, files);
@@ -65,6 +68,9 @@ void registerViews(MainWindow& window, SessionState& state, const Files& files) 
     });
     window.registerView(PageId::B3, [&](Page& page, const Theme& theme) {
         return std::make_unique<B3View>(static_cast<B3&>(page), state, theme);
+    });
+    window.registerView(PageId::tFrmNew, [&](Page& page, const Theme& theme) {
+        return std::make_unique<tFrmNewView>(static_cast<tFrmNew&>(page), chain, state, theme);
     });
     window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
         return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);

@@ -11,6 +11,6 @@ struct SessionState;
 
 // Which pages there are, and which view shows each.
 void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment);
-void registerViews(MainWindow& window, SessionState& state, const Files& files);
+void registerViews(MainWindow& window, PageChain& chain, SessionState& state, const Files& files);
 
 } // namespace lumora

@@ -92,7 +92,7 @@ Result<void> Program::start() {
     m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
-    registerViews(parts.window, parts.state, parts.files);
+    registerViews(parts.window, parts.chain, parts.state, parts.files);
     // The process ends with the event loop, which may be one of a question: each of them has to come back.
     QObject::connect(
         &parts.chain, &PageChain::ended, qApp, [] { QCoreApplication::exit(0); }, Qt::QueuedConnection);

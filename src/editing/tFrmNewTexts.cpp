@@ -32,7 +32,7 @@ void tFrmNew::setTexts() {
     setHint(Image2[6], u"הוסף צבע אדום", u"Add red colour");
     set(Image2[7], u"עיניים אדומות", u"Red eyes");
     setHint(Image2[7], u"עבור לדף תיקון עניים אדומות", u"Go to the red-eye page");
-    set(Image2[8], u"בטל צבע", u"No added colour");
+    set(Image2[8], u"בטל צבע", u"No tint");
     setHint(Image2[8], u"בטל הוספת צבעים", u"Cancel added colours");
     set(Image2[10], u"כחול", u"Blue");
     setHint(Image2[10], u"הוסף צבע כחול", u"Add blue colour");

@@ -100,6 +100,9 @@ public:
 
     // --- state ---
 
+    // Pictures are chosen as they are, and not edited.
+    bool plain() const;
+
     // Plain, or open in the editor (orange, 33023).
     enum class KeyColour { System, Orange };
     struct KeyCaption : Caption {
@@ -202,7 +205,6 @@ public:
 private:
     enum class Guide { None, PicturesShown, ChooseByHand };
 
-    bool plain() const;
     void takeFocus(const QString& box);
     void say(const QString& hebrew, const QString& english);
 

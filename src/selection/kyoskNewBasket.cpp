@@ -41,7 +41,7 @@ void kyoskNew::Picture1_Click(int cell) {
     if (plain()) {
         AddSimple(cell);
     } else {
-        Command5_Click(); // the picture that is left
+        leaveEditor(); // by the small pictures below it
         AddForEditor(cell);
         openInEditor(cell);
     }

@@ -22,7 +22,10 @@ void kyoskNew::setBrowserTexts() {
 
     Label15.text = m_state.shemot.ppr;
     Label18.text = m_state.shemot.ppr;
-    set(Title, u"בחירת תמונות", u"Choose your pictures");
+    if (plain())
+        set(Title, u"בחירת תמונות", u"Choose your pictures");
+    else
+        set(Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it");
     set(Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
         u"Your pictures will show here\nPress Add pictures and select one picture of the folder");
     set(Label7Prompt, u"עותקים", u"Copies");

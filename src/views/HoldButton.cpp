@@ -9,6 +9,8 @@ HoldButton::HoldButton(Handlers handlers, QWidget* parent)
     , m_handlers(std::move(handlers)) {
     setFocusPolicy(Qt::TabFocus);
     setAutoRepeat(false); // the page's timer gives the pace
+    if (!m_handlers.down)
+        return;
     connect(this, &QPushButton::pressed, this, [this] {
         m_held = true;
         m_handlers.down();

@@ -18,6 +18,7 @@ public:
         std::function<void()> tap;
         std::function<void()> up;
     };
+    // Without handlers it is a plain button.
     HoldButton(Handlers handlers, QWidget* parent);
 
     bool isHeld() const { return m_held; }

@@ -132,17 +132,20 @@ void PictureCell::paintEvent(QPaintEvent*) {
         painter.drawPixmap(room.center() - QPoint(size / 2, size / 2),
                            theme().icon(u"picture"_s, size, Theme::Colour::Edge));
     }
-    if (m_look.chosen) {
+    if (m_look.chosen || m_look.inEditor) {
         const double radius = theme().px(14);
         const QPointF at(layoutDirection() == Qt::RightToLeft ? card.left() + radius + theme().px(5)
                                                               : card.right() - radius - theme().px(5),
                          card.top() + radius + theme().px(5));
         painter.setPen(QPen(Qt::white, theme().px(2)));
-        painter.setBrush(Theme::Colour::Primary);
+        painter.setBrush(m_look.inEditor ? Theme::Colour::Sun : Theme::Colour::Primary);
         painter.drawEllipse(at, radius, radius);
         const int size = theme().px(19);
-        painter.drawPixmap(at - QPointF(size / 2.0, size / 2.0), theme().icon(u"tick"_s, size, Qt::white));
-    } else {
+        painter.drawPixmap(at - QPointF(size / 2.0, size / 2.0), m_look.inEditor
+                                                                     ? theme().icon(u"edit"_s, size, Theme::Colour::Ink)
+                                                                     : theme().icon(u"tick"_s, size, Qt::white));
+    }
+    if (!m_look.chosen) {
         painter.setFont(theme().font(Theme::Type::Small));
         painter.setPen(Theme::Colour::Muted);
         const QRectF line(theme().px(8), m_strip->y(), width() - theme().px(16), m_strip->height());

@@ -133,6 +133,7 @@ QPushButton[role="danger"] { border-color: $Danger; color: $Danger; }
 QPushButton[role="danger"]:hover { background: $DangerSoft; border-color: $Danger; }
 QPushButton[role="danger"]:disabled { border-color: $Line; color: $Muted; }
 QPushButton[role="tall"] { min-height: @52px; padding: 0 @8px; font-size: @15px; }
+QPushButton[role="tool"] { padding: 0; min-width: 44px; min-height: 44px; border: none; }
 QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }
 QPushButton[role="done"] { border: none; background: $Primary; color: white; padding: 0 @26px; }
 QPushButton[role="done"]:hover, QPushButton[role="done"]:pressed { background: $PrimaryDark; }

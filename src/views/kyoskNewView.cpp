@@ -488,7 +488,8 @@ void kyoskNewView::renderCells() {
             !look.filled ? wording(u"תא ריק"_s, u"Empty place"_s)
             : look.chosen
                 ? wording(u"%1, נבחרה, עותקים: %2"_s, u"%1, chosen, copies: %2"_s).arg(look.name, look.copies.trimmed())
-                : wording(u"%1, לחץ לבחירה"_s, u"%1, press to choose"_s).arg(look.name));
+            : m_page.plain() ? wording(u"%1, לחץ לבחירה"_s, u"%1, press to choose"_s).arg(look.name)
+                             : wording(u"%1, לחץ לעריכה"_s, u"%1, press to edit"_s).arg(look.name));
         speak(m_cells[i]->plus(), wording(u"עותק נוסף של %1"_s, u"One more copy of %1"_s).arg(look.name));
         speak(m_cells[i]->minus(), wording(u"עותק אחד פחות של %1"_s, u"One copy less of %1"_s).arg(look.name));
     }

@@ -16,11 +16,14 @@
 #include <QAccessible>
 #include <QComboBox>
 #include <QCoreApplication>
+#include <QDir>
 #include <QElapsedTimer>
 #include <QFile>
+#include <QImage>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
+#include <QPainter>
 #include <QPushButton>
 #include <QTest>
 
@@ -206,6 +209,43 @@ void Walk::choosePictures() {
 
 void Walk::toClosing() {
     press(u"kyoskNew"_s, u"Image7"_s);
+}
+
+void Walk::writeFrames() {
+    const QString root = m_folder.filePath(u"drive_c/2000lumora/misgarot"_s);
+    for (const auto& [category, count] : {std::pair("Classic", 8), std::pair("Party", 3)}) {
+        const QDir folder(root + u'/' + QString::fromLatin1(category));
+        ASSERT_TRUE(QDir().mkpath(folder.path()));
+        for (int i = 1; i <= count; ++i) {
+            QImage frame(450, 300, QImage::Format_RGB32);
+            frame.fill(QColor::fromHsv(i * 40, i == 1 ? 0 : 160, i == 2 ? 30 : 230));
+            const int border = 10 + 4 * i;
+            QPainter(&frame).fillRect(frame.rect().adjusted(border, border, -border, -border), Qt::black);
+            const QString name = QString::number(i).rightJustified(3, u'0');
+            EXPECT_TRUE(frame.save(folder.filePath(u'k' + name + u".bmp"_s)));
+            EXPECT_TRUE(frame.save(folder.filePath(name + u".bmp"_s)));
+            EXPECT_TRUE(frame.save(folder.filePath(name + u".png"_s)));
+        }
+    }
+}
+
+void Walk::toEditor(bool english) {
+    writeFrames();
+    if (english)
+        press(u"hatchala"_s, u"Check1"_s);
+    press(u"hatchala"_s, u"Image1"_s);
+    waitFor(u"nnn"_s);
+    press(u"nnn"_s, u"Image1(1)"_s);
+    toOptions();
+    press(u"nnn"_s, u"Option1(0)"_s);
+    press(u"nnn"_s, u"Option3(1)"_s);
+    toPictures();
+    m_program->dialogs().nextPick = [this] { return pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    press(u"kyoskNew"_s, u"Image5"_s);
+    m_program->dialogs().nextPick = {};
+    settle(300);
+    press(u"kyoskNew"_s, u"Picture1(0)"_s);
+    waitFor(u"tFrmNew"_s);
 }
 
 void Walk::shot(const QString& name) {

@@ -42,6 +42,8 @@ public:
     void toPictures();
     void choosePictures();
     void toClosing();
+    // A quick order with the first picture open in the editor. The lab has frames in two categories.
+    void toEditor(bool english);
 
     // Writes the window to the folder that LUMORA_SHOTS names; without one nothing is written.
     void shot(const QString& name);
@@ -50,6 +52,7 @@ public:
 
 private:
     Page* find(PageId id);
+    void writeFrames();
 
     QTemporaryDir m_folder;
     std::unique_ptr<Program> m_program;
