@@ -7,20 +7,12 @@ Each peer is run in pairs with ours, in turn first and second, so that whatever 
 a pair is peer's time / ours, and the median of the pairs is printed. Times are processor time; for more than one thread they are
 elapsed time. --install fetches the peers from Debian first (root or sudo).
 """
-import argparse, os, shutil, statistics, subprocess, sys, tempfile, time
+import argparse, os, shutil, subprocess, sys, tempfile
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), ".."))
+from pairs import HEADING, compare
 
 PACKAGES = ["libvips-tools", "imagemagick", "libopencv-imgproc-dev", "libopencv-imgcodecs-dev", "libzimg-dev"]
-
-
-def run(command, environment=None):
-    """Elapsed seconds and processor seconds."""
-    begin = time.monotonic()
-    process = subprocess.Popen(command, stdout=subprocess.DEVNULL, env={**os.environ, **(environment or {})})
-    _, status, usage = os.wait4(process.pid, 0)
-    process.returncode = os.waitstatus_to_exitcode(status)
-    if process.returncode != 0:
-        sys.exit(f"failed with {process.returncode}: {' '.join(command[:6])} ...")
-    return time.monotonic() - begin, usage.ru_utime + usage.ru_stime
 
 
 def main():
@@ -69,31 +61,15 @@ def main():
             ("small pictures: vipsthumbnail, 1 thread", vips_small, one, ours("small", "1"), ""),
             ("small pictures: vipsthumbnail / ours on 2 threads, elapsed", vips_small, one, ours("small", "2"), ">= 2.2"),
         ]
-        print(f"{'peer / ours':62} {'goal':>8} {'median':>7} {'lowest':>7} {'highest':>7}")
-
-        def compare(label, peer, environment, mine, goal):
-            elapsed = "elapsed" in label
-            if not peer:
-                print(f"{label:62} {goal:>8}   not installed")
-                return
-            ratios = []
-            run(mine)
-            for turn in range(options.rounds):
-                if turn % 2:
-                    theirs, ourtime = run(peer, environment), run(mine)
-                else:
-                    ourtime, theirs = run(mine), run(peer, environment)
-                ratios.append(theirs[not elapsed] / ourtime[not elapsed])
-            print(f"{label:62} {goal:>8} {statistics.median(ratios):7.2f} {min(ratios):7.2f} {max(ratios):7.2f}", flush=True)
-
+        print(HEADING)
         for line in lines:
-            compare(*line)
+            compare(*line, options.rounds)
         # The other way round: ours above, the floor below.
         run(ours("planes", "-"))
         floor = ours("floor", "-")
-        compare("paper: ours / floor", ours("paper"), None, floor, "<= 1.20")
-        compare("paper: ours with SSSE3 / floor", ours("paper", "SSSE3"), None, floor, "<= 1.30")
-        compare("paper: ours in plain C++ / floor", ours("paper", "plain"), None, floor, "")
+        compare("paper: ours / floor", ours("paper"), None, floor, "<= 1.20", options.rounds)
+        compare("paper: ours with SSSE3 / floor", ours("paper", "SSSE3"), None, floor, "<= 1.30", options.rounds)
+        compare("paper: ours in plain C++ / floor", ours("paper", "plain"), None, floor, "", options.rounds)
         kib = lambda command: int(subprocess.run(command, check=True, capture_output=True, text=True).stdout.split()[0])
         idle = kib([os.path.join(programs, "bench_ours"), "idle", "-", "-"])
         peak = kib(ours("paper"))
