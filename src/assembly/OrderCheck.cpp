@@ -112,12 +112,7 @@ private:
     void fault(const QString& text) { m_report.faults += text; }
 
     void checkTotals() {
-        double copies = 0;
-        for (const QString& item : m_log.items) {
-            if (item.right(3) != QLatin1String("txt"))
-                copies += Val(item.left(2));
-        }
-        m_report.copies = HoldIn16Bits(copies);
+        m_report.copies = OrderItem::copiesOf(m_log.items);
         if (m_report.copies != m_log.total)
             fault(
                 QStringLiteral("the log's total is %1, its lines add up to %2").arg(m_log.total).arg(m_report.copies));

@@ -1,9 +1,13 @@
 #pragma once
 
 #include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "editing/EditRecord.h"
 
 #include <QString>
+#include <QStringList>
+
+#include <cstdint>
 
 namespace lumora {
 
@@ -19,6 +23,16 @@ struct OrderItem {
         constexpr int codeWidth = 9;
         const int recordWidth = form == Form::Edited ? EditRecord::width : 0;
         return {item.left(codeWidth), item.mid(codeWidth, recordWidth), item.mid(codeWidth + recordWidth)};
+    }
+
+    // The copies of all lines but texts, held at 32767.
+    static std::int16_t copiesOf(const QStringList& items) {
+        double total = 0;
+        for (const QString& item : items) {
+            if (item.right(3) != QLatin1String("txt"))
+                total += Val(item.left(2));
+        }
+        return HoldIn16Bits(total);
     }
 
     // The lab knows no names of fewer than five characters: such a line is passed over without a word.

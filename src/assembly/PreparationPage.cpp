@@ -1,6 +1,6 @@
 #include "assembly/PreparationPage.h"
 
-#include "common/FixedText.h"
+#include "assembly/OrderItem.h"
 #include "platform/Dialogs.h"
 #include "platform/Files.h"
 #include "platform/Machine.h"
@@ -36,12 +36,7 @@ bool PreparationPage::takeLines() {
 }
 
 void PreparationPage::CountTotalPics() {
-    double total = 0;
-    for (const QString& item : List1.items()) {
-        if (item.right(3) != QLatin1String("txt"))
-            total += Val(item.left(2));
-    }
-    m_state.shemot.TotalPics = HoldIn16Bits(total);
+    m_state.shemot.TotalPics = OrderItem::copiesOf(List1.items());
     Label5.text = QString::number(m_state.shemot.TotalPics);
 }
 
