@@ -40,13 +40,24 @@ void UnpackEditState(const QString& record, EditFields& fields) {
     const auto text = [&](R::Column column) { return fields.EditState.mid(column.position - 1, column.width); };
     const auto number = [&](R::Column column) { return Val16(text(column)); };
 
-    fields.GainR = static_cast<float>(Val(text(R::GainR)));
-    fields.GainG = static_cast<float>(Val(text(R::GainG)));
-    fields.GainB = static_cast<float>(Val(text(R::GainB)));
-    fields.RotationCode = number(R::RotationCode);
-    fields.ZoomPercent = number(R::ZoomPercent);
-    fields.PanX = number(R::PanX);
-    fields.PanY = number(R::PanY);
+    // Where a damaged record has letters for a number the picture stays without that edit: read as 0 they would print
+    // it black, or shrunk to nothing.
+    const auto unlessLetters = [&](R::Column column, double without) {
+        const QString field = text(column);
+        const bool letters =
+            !field.trimmed().isEmpty() && std::none_of(field.begin(), field.end(), [](QChar c) { return c.isDigit(); });
+        return letters ? without : Val(field);
+    };
+    const auto placed = [&](R::Column column, std::int16_t without) {
+        return unlessLetters(column, without) == without ? without : number(column);
+    };
+    fields.GainR = static_cast<float>(unlessLetters(R::GainR, 1));
+    fields.GainG = static_cast<float>(unlessLetters(R::GainG, 1));
+    fields.GainB = static_cast<float>(unlessLetters(R::GainB, 1));
+    fields.RotationCode = placed(R::RotationCode, 180);
+    fields.ZoomPercent = placed(R::ZoomPercent, 100);
+    fields.PanX = placed(R::PanX, 999);
+    fields.PanY = placed(R::PanY, 999);
     fields.ToneFlag = number(R::ToneFlag);
     fields.SpareFlag = number(R::SpareFlag);
     fields.FrameName = text(R::FrameName);
