@@ -171,11 +171,11 @@ void eyes(QPainter& painter) {
         painter.setClipPath(lid);
         painter.fillPath(lid, QColor(248, 246, 242));
         painter.setPen(Qt::NoPen);
-        QRadialGradient iris(at, radius * 2);
-        iris.setColorAt(0.4, QColor(104, 72, 44));
+        QRadialGradient iris(at, radius * 2.5);
+        iris.setColorAt(0.35, QColor(104, 72, 44));
         iris.setColorAt(1, QColor(58, 40, 26));
         painter.setBrush(iris);
-        painter.drawEllipse(at, radius * 2, radius * 2);
+        painter.drawEllipse(at, radius * 2.5, radius * 2.5);
         QRadialGradient red(at, radius);
         red.setColorAt(0, QColor(236, 44, 48));
         red.setColorAt(0.8, QColor(206, 26, 34));

@@ -13,6 +13,6 @@ Bitmap portrait(int width);
 
 // Where the red pupils are, in shares of the picture's width and height, and their radius in shares of the width.
 inline constexpr std::array<QPointF, 2> redPupils = {QPointF(0.395, 0.415), QPointF(0.605, 0.415)};
-inline constexpr double pupilRadius = 0.0165;
+inline constexpr double pupilRadius = 0.0115;
 
 } // namespace lumora::demo
