@@ -186,8 +186,6 @@ void EditedPreview::prepareOverlay(const EditFields& edit, const std::optional<B
     if (m_overlay.scale != scale) {
         m_overlay = {};
         m_overlay.scale = scale;
-        m_overlay.background =
-            m_colour ? Bitmap(size.width, size.height, *m_colour) : resampled(sourceFor(scale), size);
     }
     if (!frame) {
         m_overlay.frame = {};
@@ -212,7 +210,13 @@ Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>
     placement.drawHeight *= scale;
     placement.panX *= scale;
     placement.panY *= scale;
-    Bitmap paper = m_overlay.background;
+    const PictureSize size = scaledSize(m_box, scale);
+    const bool uncovered = !placement.covers(size);
+    if (uncovered && m_overlay.background.isNull())
+        m_overlay.background =
+            m_colour ? Bitmap(size.width, size.height, *m_colour) : resampled(sourceFor(scale), size);
+    // The stretched picture takes longer than all the rest; as long as nothing of it shows it is not made.
+    Bitmap paper = uncovered ? m_overlay.background : Bitmap(size.width, size.height, Qt::white);
     drawPlaced(paper, sourceFor(scale), placement, coloursOf(edit));
     drawOver(paper, m_overlay.frame, m_overlay.ink);
     return paper;
