@@ -35,11 +35,15 @@ bool within(const std::array<CheckCaption, N>& options, int index) {
 
 nnn::nnn(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::nnn)
+    , album(state, platform)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain) {
     Frame1.visible = false;
     Label4kpn.visible = false;
+    connect(&album, &AlbumPanels::changed, this, &nnn::showStep);
+    connect(&album, &AlbumPanels::focusWanted, this, &nnn::focusOn);
+    connect(&album, &AlbumPanels::checked, this, &nnn::takeAlbum);
 }
 
 void nnn::load() {
@@ -92,8 +96,8 @@ void nnn::Image1_Click(int tile) {
             break;
         clearChoices();
         m_state.Optint = 10;
-        tell(QStringLiteral("הזמנת אלבום הורים עדיין אינה זמינה בגרסה זו"),
-             QStringLiteral("Ordering a parent album is not yet available in this version"));
+        album.begin();
+        open(Step::Album);
         break;
     case RestartTile:
         m_state.Optint = 7;
@@ -160,6 +164,7 @@ void nnn::clearChoices() {
     Check1.checked = false;
     m_termsHint = true;
     Label4kpn.visible = false;
+    album.close();
     fillSizes();
 }
 
@@ -333,19 +338,38 @@ void nnn::Command30_Click() {
 }
 
 void nnn::Command3_Click() {
-    if (m_leaving || !termsAgreed())
+    if (m_leaving || !termsAgreed(Check1))
         return;
     takeDetails(m_state, Text2.text, Text3.text, Text4.text);
     if (const std::optional<DetailsProblem> problem = CheckDetails(m_state)) {
         refuse(*problem);
         return;
     }
+    rememberOrForget();
+    if (m_state.Optint >= 1 && m_state.Optint <= 3)
+        GoToSelection();
+}
+
+void nnn::rememberOrForget() {
     if (Check2.checked) {
         saveDetails();
     } else if (const Result<void> forgotten = DetailStore(m_state, m_platform.files).forgetDetails(); !forgotten) {
         m_platform.dialogs.message(forgotten.failure().message);
     }
-    if (m_state.Optint >= 1 && m_state.Optint <= 3)
+}
+
+void nnn::takeAlbum() {
+    rememberOrForget();
+    takeDetails(m_state, Text2.text, Text3.text, Text4.text);
+    Command24_Click();
+}
+
+void nnn::Command24_Click() {
+    if (m_leaving || !termsAgreed(album.Check6))
+        return;
+    m_state.Optint = 10;
+    m_state.ModulRezef = true;
+    if (beginTile())
         GoToSelection();
 }
 
@@ -430,7 +454,7 @@ void nnn::CouponOrder(Coupon coupon) {
     m_state.coupon.LargeCount = coupon == Coupon::Small ? 3 : 5;
     Option1[0].text = QStringLiteral("10/15");
     Option1[1].text = QStringLiteral("20/30");
-    if (termsAgreed())
+    if (termsAgreed(Check1))
         nameGiven();
     Q_EMIT changed();
 }
@@ -456,6 +480,10 @@ void nnn::Command4_Click() {
     case Step::Terms:
         open(asksFit() ? Step::Fit : asksBorder() ? Step::Border : Step::Options);
         break;
+    case Step::Album:
+        if (!album.back())
+            Command2_Click();
+        break;
     }
 }
 
@@ -463,6 +491,7 @@ void nnn::Command2_Click() {
     Command12.enabled = true;
     Frame1.visible = false;
     markedTile = -1;
+    album.close();
     open(Step::Menu);
 }
 

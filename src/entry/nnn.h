@@ -1,5 +1,6 @@
 #pragma once
 
+#include "entry/AlbumPanels.h"
 #include "entry/DetailsCheck.h"
 #include "platform/Platform.h"
 #include "session/Caption.h"
@@ -30,6 +31,7 @@ public:
         Border,  // Picture4: Image13, Picture16, Command6
         Fit,     // Picture5: Option4, Option5
         Terms,   // Check1, Command29, Command3
+        Album,   // the panels of a parent album
     };
 
     // --- events ---
@@ -53,6 +55,7 @@ public:
     void Command29_Click();            // reads the terms
     void Command30_Click();            // closes the hint beside the terms
     void Command3_Click();             // the last button: checks, then the pictures
+    void Command24_Click();            // the last button of an album, pressed once the album is checked
     void Command4_Click();             // one step back
     void Command2_Click();             // cancel: back to the menu
     void Command5_Click();             // fills the messages and texts in the language of the session
@@ -68,6 +71,8 @@ public:
     void CouponOrder(Coupon coupon);
 
     // --- state ---
+
+    AlbumPanels album; // with its own events
 
     Step step = Step::Menu;
     Caption Title;     // what the open step asks for
@@ -142,7 +147,9 @@ private:
     void afterKind();
     bool asksBorder() const;
     bool asksFit() const;
-    bool termsAgreed();
+    bool termsAgreed(const CheckCaption& box);
+    void rememberOrForget();
+    void takeAlbum();
     bool nameGiven();
     QString sizesPrompt() const;
     void saveDetails();

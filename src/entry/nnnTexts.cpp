@@ -102,6 +102,7 @@ void nnn::setTexts() {
     Command9.text = s.wording(u"השאר"_qs, u"Keep them"_qs);
     if (Combo1List.currentIndex() < 0 && m_state.shemot.ppr != Combo1.text)
         Combo1.text = sizesPrompt();
+    album.setTexts();
     showStep();
 }
 
@@ -118,12 +119,12 @@ void nnn::fillSizes() {
     Combo1.text = sizesPrompt();
 }
 
-bool nnn::termsAgreed() {
-    if (!Check1.checked)
+bool nnn::termsAgreed(const CheckCaption& box) {
+    if (!box.checked)
         tell(
             u"רק עם הנך מסכים מסכימה לתנאי שימוש \nסמן את התיבה   מסכים לתנאי שימוש\nתוכל לקרוא את תנאי השימוש אם אינך יודע אותם"_qs,
             u"Please tick the box \"I agree to the terms of use\" before you go on.\nYou can read the terms here if you do not know them."_qs);
-    return Check1.checked;
+    return box.checked;
 }
 
 bool nnn::nameGiven() {
@@ -207,7 +208,10 @@ void nnn::showProgress() {
         steps += Step::Fit;
     steps += Step::Terms;
     StepLine.visible = step != Step::Menu;
-    StepLine.text = s.wording(u"שלב %1 מתוך %2"_qs, u"Step %1 of %2"_qs).arg(steps.indexOf(step) + 1).arg(steps.size());
+    const bool ofAlbum = step == Step::Album;
+    StepLine.text = s.wording(u"שלב %1 מתוך %2"_qs, u"Step %1 of %2"_qs)
+                        .arg(1 + (ofAlbum ? static_cast<qsizetype>(album.panel) : steps.indexOf(step)))
+                        .arg(ofAlbum ? AlbumPanels::panelCount : steps.size());
     switch (step) {
     case Step::Menu:
         Title.text = s.wording(u"מה תרצו להזמין?"_qs, u"What would you like to order?"_qs);
@@ -227,10 +231,13 @@ void nnn::showProgress() {
     case Step::Terms:
         Title.text = s.wording(u"תנאי שימוש"_qs, u"Terms of use"_qs);
         break;
+    case Step::Album:
+        Title.text = album.Pic4Alboom.text.trimmed();
+        break;
     }
 
     QStringList choice;
-    const bool started = step != Step::Menu && step != Step::Details;
+    const bool started = step != Step::Menu && step != Step::Details && !ofAlbum;
     if (started && s.shemot.ppr != notChosen)
         choice += s.shemot.ppr;
     if (started && s.shemot.maat != notChosen)
@@ -239,8 +246,8 @@ void nnn::showProgress() {
         choice += Image13[static_cast<std::size_t>(Picture16)].text;
     if (step == Step::Terms && (Option4.checked || Option5.checked))
         choice += Option4.checked ? Option4.text : Option5.text;
-    Choice.text = choice.join(u" · "_qs);
-    Choice.visible = !choice.isEmpty();
+    Choice.text = ofAlbum ? album.ChoiceSoFar.text : choice.join(u" · "_qs);
+    Choice.visible = ofAlbum ? album.ChoiceSoFar.visible : !choice.isEmpty();
 }
 
 } // namespace lumora

@@ -34,7 +34,9 @@ void kyoskNew::load() {
     for (Caption* hidden : {&Frame2, &Pic4Brose, &Picture66, &Label35, &Label36, &Image19, &Image20, &editorView,
                             &Frame3, &PicB4Sioom, &Frame4, &Pic4snifim, &Pic4Snif, &Picture7, &Txt4Ml2, &Label24})
         hidden->visible = false;
+    // An album order has a finish of its own, until the whole folder is taken.
     Image13.visible = m_state.Optint == 10;
+    Image7.visible = !Image13.visible;
     const bool coupon = m_state.coupon.HaKoopon == 1;
     for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3})
         couponOnly->visible = coupon;

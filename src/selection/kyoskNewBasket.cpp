@@ -181,6 +181,7 @@ void kyoskNew::Command24_Click() {
     Timer2.stop();
     for (Caption* part : {&Image13, &Label36, &Image20})
         part->visible = false;
+    Image7.visible = true;
     SumCopies();
     List4.PageBack();
     ShowPage();

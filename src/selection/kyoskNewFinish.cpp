@@ -4,6 +4,7 @@
 #include "platform/Platform.h"
 #include "selection/FinishRule.h"
 #include "selection/kyoskNew.h"
+#include "session/MailDomains.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
@@ -36,13 +37,10 @@ void kyoskNew::Command3_Click() {
 }
 
 void kyoskNew::fillDomains() {
-    Combo1Items = {QStringLiteral("gmail.com"),        QStringLiteral("walla.co.il"),  QStringLiteral("walla.com"),
-                   QStringLiteral("hotmail.com"),      QStringLiteral("outlook.com"),  QStringLiteral("yahoo.com"),
-                   QStringLiteral("icloud.com"),       QStringLiteral("zahav.net.il"), QStringLiteral("bezeqint.net"),
-                   QStringLiteral("netvision.net.il"), QStringLiteral("012.net.il")};
+    Combo1Items = mailDomains();
     Combo1Index = -1;
     m_promptStands = true;
-    Combo1.text = m_state.wording(QStringLiteral("בחר או הקלד"), QStringLiteral("Choose or type"));
+    Combo1.text = mailDomainPrompt(m_state.english());
 }
 
 bool kyoskNew::couponRefuses() {

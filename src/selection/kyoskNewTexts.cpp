@@ -1,5 +1,6 @@
 // All texts of the page of pictures, in both languages.
 #include "selection/kyoskNew.h"
+#include "session/MailDomains.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -120,7 +121,7 @@ void kyoskNew::setClosingTexts() {
     set(Label33, u"דואר אלקטרוני שדה חובה", u"E-mail is a required field");
     set(Text2Prompt, u"הערות", u"Notes");
     if (m_promptStands)
-        set(Combo1, u"בחר או הקלד", u"Choose or type");
+        Combo1.text = mailDomainPrompt(m_state.english());
     set(LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
         u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box ");
     Label4kpn3.text = QString::number(m_state.coupon.MisparKoopon);

@@ -1,0 +1,332 @@
+#include "entry/nnn.h"
+
+#include "entry/DetailStore.h"
+#include "session/ClientProfile.h"
+#include "session/Deployment.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+
+namespace lumora {
+namespace {
+
+using Panel = AlbumPanels::Panel;
+
+constexpr int albumTile = 6;
+const QString photographerStore = QStringLiteral("C:\\2000lumora\\pratim2.txt");
+const QString customerStore = QStringLiteral("C:\\2000lumora\\pratim.txt");
+
+class AlbumTest : public ::testing::Test {
+protected:
+    AlbumTest() {
+        state.DiskRoot = machine.drives.programRoot();
+        state.KodMishloach = QStringLiteral("KUP");
+        chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
+        chain.registerPage(PageId::nnn, [this] { return std::make_unique<nnn>(state, machine.platform, chain); });
+    }
+    nnn& start() {
+        LoadDefaultProfile(state, deployment);
+        machine.dialogs.messages.clear();
+        chain.show(PageId::nnn);
+        nnn& page = static_cast<nnn&>(*chain.front());
+        page.Image1_Click(albumTile);
+        return page;
+    }
+    void fillPhotographer(AlbumPanels& album) {
+        const char* const typed[] = {" Studio Or ", "03-7654321", "Noa's wedding", "studio"};
+        for (int i = 0; i < 4; ++i)
+            album.Text1_Change(i, QString::fromLatin1(typed[i]));
+        album.Combo4Mail_Change(QStringLiteral("example.com"));
+    }
+    // All that an order needs, as far as the bill, with the terms ticked.
+    nnn& atBill() {
+        nnn& page = start();
+        AlbumPanels& album = page.album;
+        fillPhotographer(album);
+        album.Command17_Click();
+        album.SoogAlb_Click(5);
+        album.Check4_Click(true);
+        album.Command27_Click();
+        album.Combo4Horim_Click(4);
+        album.Command16_Click();
+        album.Combo4Godel_Click(2);
+        album.Command18_Click();
+        album.Combo4Cricha_Click(0);
+        album.Command19_Click();
+        album.Combo4Niyar_Click(2);
+        album.Command20_Click();
+        album.Combo4Tosefet_Click(1);
+        album.Check3_Click(2, true);
+        album.Command21_Click();
+        album.Check6_Click(true);
+        return page;
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    Deployment deployment;
+    PageChain chain{machine.pump};
+};
+
+TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
+    state.album.HearotLBM = QStringLiteral("of an album before");
+    nnn& page = atBill();
+    EXPECT_EQ(page.step, nnn::Step::Album);
+    EXPECT_EQ(page.album.panel, Panel::Bill);
+    EXPECT_EQ(page.StepLine.text, u"שלב 7 מתוך 7");
+    EXPECT_EQ(page.album.Pic4BilLines, (QStringList{"Studio Or", "Noa's wedding", "03-7654321", "studio@example.com",
+                                                    "פוטו גדול", "חום", "משי", "קנבס", "30/60"}));
+    EXPECT_EQ(page.album.Pic4BilExtras, (QStringList{"עוד=0", "הטבעת שם בכריכה=0", "פינות עגולות=1", "מזוודה=0",
+                                                     "סובלימציה=0", "פתיחה אנגלית=0"}));
+    EXPECT_EQ(page.album.Pic4BilParents,
+              (QStringList{QString(25, u'_'), "  אלבום הורים  2", "30/60=אלבום הורים", QString(25, u'_')}));
+
+    page.album.Command22_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::kyoskNew) << qPrintable(machine.dialogs.messages.join(u'\n'));
+    EXPECT_EQ(chain.find(PageId::nnn), nullptr);
+    EXPECT_TRUE(state.ModulRezef);
+    EXPECT_EQ(state.Optint, 10);
+    EXPECT_EQ(state.shemot.ppr, u"30/60");
+    EXPECT_EQ(state.shemot.maat, u"M");
+    EXPECT_EQ(state.shemot.Bord, u"NB");
+    EXPECT_EQ(state.shemot.FillFit, u"FFF");
+    EXPECT_EQ(state.shemot.n1, u"") << "the photographer stands in the album's own fields";
+    EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
+    EXPECT_EQ(state.MisparHazmana, u"100");
+    EXPECT_EQ(state.album.KamutHorim, u"2");
+    EXPECT_EQ(state.album.SoogHorim, u"30/60");
+    EXPECT_EQ(state.album.HearotLBM, u"");
+}
+
+TEST_F(AlbumTest, WhatIsMissingIsToldOnThePanelWhereItIsSetRight) {
+    const struct {
+        const char* what;
+        std::function<void(AlbumPanels&)> takeAway;
+        const char16_t* message; // nothing: the order goes on
+        Panel panel;
+        const char* focus;
+    } cases[] = {
+        {"name", [](AlbumPanels& a) { a.Text1_Change(0, u"  "_qs); }, u"לא כתבת שם צלם", Panel::Photographer,
+         "Text1(0)"},
+        {"telephone", [](AlbumPanels& a) { a.Text1_Change(1, {}); }, u"לא כתבתה מספר טלפון", Panel::Photographer,
+         "Text1(1)"},
+        {"event", [](AlbumPanels& a) { a.Text1_Change(2, {}); }, u"לא כתבת שם אירוע", Panel::Photographer, "Text1(2)"},
+        {"mail", [](AlbumPanels& a) { a.Text1_Change(3, {}); }, u"לא כתבת דואר אלקטרוני", Panel::Photographer,
+         "Text1(3)"},
+        {"name and size: the first alone",
+         [](AlbumPanels& a) {
+             a.Text1_Change(0, {});
+             a.Command16_Click();
+         },
+         u"לא כתבת שם צלם", Panel::Photographer, "Text1(0)"},
+        {"kind", [](AlbumPanels& a) { a.begin(); }, u"לא בחרת סוג אלבום", Panel::Kind, "SoogAlb(0)"},
+        {"size, cover and more, by filling the lists anew", [](AlbumPanels& a) { a.Command16_Click(); },
+         u"לא בחרת גודל אלבום", Panel::Size, "Combo4Godel"},
+        {"cover",
+         [](AlbumPanels& a) {
+             a.Command16_Click();
+             a.Combo4Godel_Click(0);
+         },
+         u"לא בחרת סוג כריכה", Panel::Cover, "Combo4Cricha"},
+        {"paper: an untouched list passes",
+         [](AlbumPanels& a) {
+             a.Command16_Click();
+             a.Combo4Godel_Click(0);
+             a.Combo4Cricha_Click(0);
+         },
+         nullptr, Panel::Bill, ""},
+        {"terms", [](AlbumPanels& a) { a.Check6_Click(false); },
+         u"רק עם הנך מסכים מסכימה לתנאי שימוש \nסמן את התיבה   מסכים לתנאי שימוש\nתוכל לקרוא את תנאי השימוש אם אינך "
+         u"יודע אותם",
+         Panel::Bill, "Text1(0)"},
+    };
+    for (const auto& c : cases) {
+        nnn& page = atBill();
+        c.takeAway(page.album);
+        machine.dialogs.messages.clear();
+        page.album.Command22_Click();
+        if (!c.message) {
+            EXPECT_EQ(chain.front()->id(), PageId::kyoskNew) << c.what;
+            EXPECT_EQ(state.album.SoogNiar, u"בחר סוג נייר");
+            EXPECT_EQ(state.album.Tosafot1[0], u"") << "an extra that was left untouched is none";
+            continue;
+        }
+        EXPECT_EQ(machine.dialogs.messages, QStringList(QString::fromUtf16(c.message))) << c.what;
+        ASSERT_EQ(chain.front(), &page) << c.what;
+        EXPECT_EQ(page.album.panel, c.panel) << c.what;
+        EXPECT_EQ(page.focusBox, QLatin1String(c.focus)) << c.what;
+        chain.unload(PageId::nnn);
+    }
+}
+
+TEST_F(AlbumTest, CopiesForTheParentsNeedAKindOfAlbumAndASize) {
+    const QString refusal = u"בחר סוג אלבום הורים\nאו שתבטל הוספת אלבום הורים\nעל ידי הורדת עותקים לאפס"_qs;
+    const struct {
+        int kind; // -1 none
+        bool copies;
+        int size; // -1 none
+        bool goesOn;
+        const char* focus;
+    } cases[] = {
+        {-1, false, -1, true, ""},           {2, false, -1, true, ""}, {-1, true, -1, false, "SoogAlb(0)"},
+        {2, true, -1, false, "Combo4Horim"}, {2, true, 0, true, ""},
+    };
+    for (const auto& c : cases) {
+        nnn& page = start();
+        AlbumPanels& album = page.album;
+        album.Command17_Click();
+        if (c.kind >= 0)
+            album.SoogAlb_Click(c.kind);
+        if (c.copies)
+            album.Check4_Click(true);
+        album.Combo4Horim_Click(c.size);
+        album.Command16_Click();
+        EXPECT_EQ(album.panel, c.goesOn ? Panel::Size : Panel::Kind);
+        EXPECT_EQ(machine.dialogs.messages, c.goesOn ? QStringList() : QStringList(refusal));
+        if (!c.goesOn) {
+            EXPECT_EQ(page.focusBox, QLatin1String(c.focus));
+            // As the message says: at no copies the way is free.
+            album.Command26_Click();
+            album.Command16_Click();
+            EXPECT_EQ(album.panel, Panel::Size);
+        }
+        chain.unload(PageId::nnn);
+    }
+}
+
+TEST_F(AlbumTest, KindsAndCopiesFollowTheirButtons) {
+    nnn& page = start();
+    AlbumPanels& album = page.album;
+    album.Command17_Click();
+    EXPECT_EQ(album.Label17.text, u"***");
+    EXPECT_EQ(album.Combo4Horim.list.count(), 0);
+    album.SoogAlb_Click(1);
+    EXPECT_EQ(album.Label17.text, u"אינדיגו  ספירלה");
+    EXPECT_EQ(album.SoogAlb[1].shade, AlbumPanels::blue);
+    album.Combo4Horim_Click(3);
+    EXPECT_EQ(album.Label36.text, u"30/40");
+    album.SoogAlb_Click(4);
+    EXPECT_EQ(album.Combo4Horim.list.count(), 10) << "each kind that is looked at adds its five";
+    EXPECT_EQ(album.Combo4Horim.box.text, u"סוג אלבום הורים");
+    EXPECT_EQ(album.Label36.text, u"");
+    EXPECT_EQ(album.SoogAlb[1].shade, AlbumPanels::grey);
+
+    EXPECT_FALSE(album.Command27.visible);
+    album.Check4_Click(true);
+    EXPECT_TRUE(album.Command26.visible && album.Command27.visible && album.Combo4Horim.box.visible);
+    for (int i = 0; i < 5; ++i)
+        album.Command27_Click();
+    EXPECT_EQ(album.Label32.text, u"4");
+    for (int i = 0; i < 5; ++i)
+        album.Command26_Click();
+    EXPECT_EQ(album.Label32.text, u"0");
+    EXPECT_FALSE(album.Check4.checked || album.Command27.visible);
+
+    // Each list keeps its prompt until a row is taken; passing a panel again loses nothing.
+    album.Command16_Click();
+    EXPECT_EQ(album.Combo4Godel.box.text, u"בחר גודל אלבום");
+    album.Combo4Godel_Click(5);
+    album.Command18_Click();
+    album.Combo4Cricha_Click(1);
+    page.Command4_Click();
+    EXPECT_EQ(album.panel, Panel::Size);
+    album.Command18_Click();
+    EXPECT_EQ(album.Combo4Cricha.box.text, u"קרם");
+    EXPECT_EQ(page.Choice.text, u"פוטו הורים · 40/80 · קרם");
+
+    // The next album begins with nothing chosen, and a print order is not touched by it.
+    page.Command2_Click();
+    EXPECT_EQ(page.step, nnn::Step::Menu);
+    page.Image1_Click(0);
+    EXPECT_EQ(state.shemot.ppr, u"***");
+    EXPECT_FALSE(album.Pic4Alboom.visible);
+    page.Image1_Click(albumTile);
+    EXPECT_EQ(album.Label17.text, u"***");
+    EXPECT_EQ(album.Combo4Horim.list.count(), 0);
+}
+
+TEST_F(AlbumTest, ThePanelsSlideIntoTheirPlaceAndStay) {
+    nnn& page = start();
+    AlbumPanels& album = page.album;
+    EXPECT_GT(album.panelShift, 0);
+    for (int i = 0; i < 20; ++i)
+        album.Timer7_Tick();
+    EXPECT_EQ(album.panelShift, 0);
+    album.Command17_Click();
+    album.SoogAlb_Click(0);
+    EXPECT_GT(album.parentsShift, 0);
+    for (int i = 0; i < 20; ++i)
+        album.Timer4Alboom_Tick();
+    EXPECT_EQ(album.parentsShift, 0);
+}
+
+TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
+    nnn& first = start();
+    first.album.Command28_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList{u"לא נמצאו פרטים בזיכרון נא הקלד פרטים"_qs});
+    EXPECT_EQ(first.focusBox, u"Text1(0)");
+    fillPhotographer(first.album);
+    first.album.Command17_Click();
+    EXPECT_FALSE(machine.files.fileExists(photographerStore));
+    first.Command4_Click();
+    first.album.Check5_Click(true);
+    first.album.Command17_Click();
+    EXPECT_EQ(*machine.files.read(photographerStore), "0\r\n\" Studio Or \"\r\n\"03-7654321\"\r\n\"studio\"\r\n0\r\n");
+    chain.unload(PageId::nnn);
+
+    nnn& second = start();
+    second.album.Text1_Change(2, QStringLiteral("Another event"));
+    second.album.Command28_Click();
+    EXPECT_EQ(second.album.Text1[0].text, u" Studio Or ");
+    EXPECT_EQ(second.album.Text1[1].text, u"03-7654321");
+    EXPECT_EQ(second.album.Text1[2].text, u"Another event");
+    EXPECT_EQ(second.album.Text1[3].text, u"studio");
+
+    // A name of one letter is too short to come back, and the box keeps what is in it.
+    ASSERT_TRUE(DetailStore(state, machine.files).SaveAlbumDetails({u"x"_qs, u"050-1"_qs, {}}).ok());
+    second.album.Command28_Click();
+    EXPECT_EQ(second.album.Text1[0].text, u" Studio Or ");
+    EXPECT_EQ(second.album.Text1[1].text, u"050-1");
+}
+
+TEST_F(AlbumTest, TheAlbumsEndRulesWhetherTheCustomersDetailsStay) {
+    for (const bool remember : {true, false}) {
+        nnn& page = atBill();
+        page.Text2_Change(QStringLiteral("Dana Levi"));
+        page.Check2_Click(remember);
+        page.album.Command22_Click();
+        EXPECT_EQ(machine.files.fileExists(customerStore), remember);
+        EXPECT_EQ(state.shemot.n1, u"Dana Levi");
+    }
+}
+
+TEST_F(AlbumTest, AWholeAddressInTheFirstBoxIsTakenAsItIs) {
+    nnn& page = atBill();
+    page.album.Text1_Change(3, QStringLiteral("studio@lab.example"));
+    page.album.Command23_Click();
+    EXPECT_EQ(state.album.MailZalam, u"studio@lab.example@example.com") << "a domain was chosen";
+    chain.unload(PageId::nnn);
+    nnn& again = start();
+    again.album.Text1_Change(3, QStringLiteral("studio@lab.example"));
+    again.album.Command23_Click();
+    EXPECT_EQ(state.album.MailZalam, u"studio@lab.example");
+}
+
+TEST_F(AlbumTest, ALanguageSwitchKeepsWhatWasTaken) {
+    nnn& page = atBill();
+    state.EnglishTips = 1;
+    page.Command5_Click();
+    EXPECT_EQ(page.album.Label17.text, u"Photo large");
+    EXPECT_EQ(page.album.Combo4Cricha.box.text, u"Brown");
+    EXPECT_EQ(page.album.Combo4Niyar.list.currentIndex(), 2);
+    EXPECT_TRUE(page.album.Pic4BilExtras.contains(u"Round corners=1"));
+    page.album.Command22_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+}
+
+} // namespace
+} // namespace lumora
