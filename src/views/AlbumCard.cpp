@@ -166,30 +166,10 @@ void AlbumCard::drawCover(QPainter& painter, const QRectF& book, QColor colour) 
 
 void AlbumCard::drawPaper(QPainter& painter, const QRectF& paper) const {
     shadow(painter, paper);
-    drawSamplePicture(painter, paper);
-    painter.save();
-    painter.setClipRect(paper);
-    if (m_drawing == Drawing::Matte) {
-        painter.fillRect(paper, QColor(255, 255, 255, 70));
-    } else if (m_drawing == Drawing::Glossy) {
-        QPainterPath shine(paper.topLeft() + QPointF(paper.width() * 0.52, 0));
-        shine.lineTo(paper.left() + paper.width() * 0.80, paper.top());
-        shine.lineTo(paper.left() + paper.width() * 0.46, paper.bottom());
-        shine.lineTo(paper.left() + paper.width() * 0.18, paper.bottom());
-        shine.closeSubpath();
-        painter.fillPath(shine, QColor(255, 255, 255, 110));
-    } else {
-        // Woven: two sets of fine lines across one another.
-        painter.setPen(QPen(QColor(255, 255, 255, 95), 1));
-        const double pace = theme().px(5);
-        for (double at = -paper.height(); at < paper.width(); at += pace) {
-            painter.drawLine(QPointF(paper.left() + at, paper.top()),
-                             QPointF(paper.left() + at + paper.height(), paper.bottom()));
-            painter.drawLine(QPointF(paper.left() + at + paper.height(), paper.top()),
-                             QPointF(paper.left() + at, paper.bottom()));
-        }
-    }
-    painter.restore();
+    drawSamplePrint(painter, paper,
+                    m_drawing == Drawing::Glossy  ? PaperFinish::Glossy
+                    : m_drawing == Drawing::Matte ? PaperFinish::Matte
+                                                  : PaperFinish::Silk);
     outline(painter, paper);
 }
 

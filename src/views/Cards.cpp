@@ -176,6 +176,37 @@ void drawSamplePicture(QPainter& painter, const QRectF& box) {
     painter.restore();
 }
 
+void drawSamplePrint(QPainter& painter, const QRectF& paper, PaperFinish finish) {
+    drawSamplePicture(painter, paper);
+    painter.save();
+    painter.setClipRect(paper, Qt::IntersectClip);
+    switch (finish) {
+    case PaperFinish::Matte:
+        painter.fillRect(paper, QColor(255, 255, 255, 70));
+        break;
+    case PaperFinish::Glossy: {
+        QPainterPath shine(paper.topLeft() + QPointF(paper.width() * 0.52, 0));
+        shine.lineTo(paper.left() + paper.width() * 0.80, paper.top());
+        shine.lineTo(paper.left() + paper.width() * 0.46, paper.bottom());
+        shine.lineTo(paper.left() + paper.width() * 0.18, paper.bottom());
+        shine.closeSubpath();
+        painter.fillPath(shine, QColor(255, 255, 255, 110));
+        break;
+    }
+    case PaperFinish::Silk: {
+        // Woven: two sets of fine lines across one another.
+        painter.setPen(QPen(QColor(255, 255, 255, 95), 1));
+        const double pace = paper.height() / 28;
+        for (double at = paper.left() - paper.height(); at < paper.right(); at += pace) {
+            painter.drawLine(QPointF(at, paper.top()), QPointF(at + paper.height(), paper.bottom()));
+            painter.drawLine(QPointF(at + paper.height(), paper.top()), QPointF(at, paper.bottom()));
+        }
+        break;
+    }
+    }
+    painter.restore();
+}
+
 void PaperCard::paintInside(QPainter& painter, const QRectF& room) {
     QString size = text();
     size.remove(QChar(0x2066)).remove(QChar(0x2069)); // set apart for a Hebrew sentence
@@ -230,19 +261,11 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
         drawSamplePicture(painter, paper);
         break;
     case Drawing::Matte:
-        drawSamplePicture(painter, paper);
-        painter.fillRect(paper, QColor(255, 255, 255, 70));
+        drawSamplePrint(painter, paper, PaperFinish::Matte);
         break;
-    case Drawing::Glossy: {
-        drawSamplePicture(painter, paper);
-        QPainterPath shine(paper.topLeft() + QPointF(paper.width() * 0.52, 0));
-        shine.lineTo(paper.left() + paper.width() * 0.80, paper.top());
-        shine.lineTo(paper.left() + paper.width() * 0.46, paper.bottom());
-        shine.lineTo(paper.left() + paper.width() * 0.18, paper.bottom());
-        shine.closeSubpath();
-        painter.fillPath(shine, QColor(255, 255, 255, 110));
+    case Drawing::Glossy:
+        drawSamplePrint(painter, paper, PaperFinish::Glossy);
         break;
-    }
     }
     painter.restore();
     painter.setPen(QPen(Theme::Colour::Edge, 1));

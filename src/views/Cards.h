@@ -121,4 +121,8 @@ private:
 // A landscape with a sun: the picture in all drawings of the program.
 void drawSamplePicture(QPainter& painter, const QRectF& box);
 
+// The same as a print on paper of this finish.
+enum class PaperFinish { Glossy, Matte, Silk };
+void drawSamplePrint(QPainter& painter, const QRectF& paper, PaperFinish finish);
+
 } // namespace lumora

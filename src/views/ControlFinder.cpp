@@ -1,6 +1,7 @@
 #include "views/ControlFinder.h"
 
 #include "session/PageChain.h"
+#include "views/ChoiceCards.h"
 #include "views/MainWindow.h"
 #include "views/PageView.h"
 
@@ -247,6 +248,13 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
             return {};
         }
         return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+    }
+    if (auto* cards = qobject_cast<ChoiceCards*>(*found)) {
+        QAbstractButton* card = cards->card(text);
+        if (!card)
+            return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+        click(*card, middleOf(*card));
+        return {};
     }
     return fail(u"%1.%2 has no rows"_s.arg(page, control));
 }

@@ -1,5 +1,7 @@
 #include "views/PageView.h"
 
+#include "views/Cards.h"
+#include "views/ChoiceCards.h"
 #include "views/Keyboard.h"
 
 #include <QAbstractButton>
@@ -132,6 +134,8 @@ void PageView::renderBindings() {
                 fillList(*list, *control.list, control.row);
             else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
                 fillCombo(*box, *control.list, *control.caption);
+            else if (auto* cards = qobject_cast<ChoiceCards*>(widget))
+                cards->display(*control.list);
         }
         if (!control.caption)
             continue;
@@ -237,6 +241,18 @@ QComboBox* PageView::comboBox(const QString& name, const TextList& list, const C
     auto* made = new QComboBox(this);
     made->setProperty("ownRing", true);
     connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
+    bind(name, made, caption);
+    m_controls.back().list = &list;
+    return made;
+}
+
+ChoiceCards* PageView::choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+                                   std::function<CardButton*(int)> maker, std::function<void(int)> activated) {
+    auto* made = new ChoiceCards(m_theme, this, columns, std::move(maker));
+    connect(made, &ChoiceCards::activated, this, [this, activated = std::move(activated)](int row) {
+        activated(row);
+        schedule(); // the press has turned the mark over by itself; the page's word counts
+    });
     bind(name, made, caption);
     m_controls.back().list = &list;
     return made;

@@ -23,6 +23,8 @@ class QPushButton;
 
 namespace lumora {
 
+class CardButton;
+class ChoiceCards;
 class Overlay;
 
 // The base of all views. A control is bound to the page's state under its design name: text, visible, enabled and hint
@@ -83,6 +85,10 @@ protected:
     // Rows from the list; what the box says from the caption, which may be a text that is no row.
     QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption,
                         std::function<void(int)> activated);
+
+    // The same as large cards, of which all rows are in sight.
+    ChoiceCards* choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+                             std::function<CardButton*(int)> maker, std::function<void(int)> activated);
 
     // Binds a widget of the view's own making.
     void bind(const QString& name, QWidget* widget, const Caption& caption);

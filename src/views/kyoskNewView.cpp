@@ -2,12 +2,12 @@
 
 #include "common/DrivePathText.h"
 #include "views/Cards.h"
+#include "views/EditableCombo.h"
 #include "views/LargePicture.h"
 #include "views/Overlay.h"
 #include "views/PictureCell.h"
 
 #include <QApplication>
-#include <QComboBox>
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QKeyEvent>
@@ -321,13 +321,9 @@ void kyoskNewView::makeClosingPanel() {
     m_at = makeLabel(address, "large");
     m_at->setText(u"@"_s);
     addressRow->addWidget(m_at);
-    m_domain = new QComboBox(address);
-    m_domain->setEditable(true);
-    m_domain->setInsertPolicy(QComboBox::NoInsert);
-    m_domain->setProperty("ownRing", true);
-    connect(m_domain, &QComboBox::activated, this, [this](int row) { m_page.Combo1_Click(row); });
-    connect(m_domain->lineEdit(), &QLineEdit::textEdited, this,
-            [this](const QString& text) { m_page.Combo1_Change(text); });
+    m_domain = new EditableCombo(
+        address, [this](int row) { m_page.Combo1_Click(row); },
+        [this](const QString& text) { m_page.Combo1_Change(text); });
     bind(u"Combo1"_s, m_domain, m_page.Combo1);
     addressRow->addWidget(m_domain, 2);
     m_albumMail = field(u"Txt4Ml2"_s, m_page.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
@@ -501,21 +497,7 @@ void kyoskNewView::renderClosing() {
     speak(m_domain, wording(u"ספק הדואר, אחרי השטרודל"_s, u"Mail provider, behind the at sign"_s));
     speak(m_albumMail, m_page.Label17.text.simplified());
     speak(m_note, m_page.Text2Prompt.text.simplified());
-    {
-        const QSignalBlocker quiet(m_domain);
-        QStringList items;
-        for (int i = 0; i < m_domain->count(); ++i)
-            items += m_domain->itemText(i);
-        if (items != m_page.Combo1Items) {
-            m_domain->clear();
-            m_domain->addItems(m_page.Combo1Items);
-        }
-        if (m_domain->currentIndex() != m_page.Combo1Index)
-            m_domain->setCurrentIndex(m_page.Combo1Index);
-        const QSignalBlocker quietToo(m_domain->lineEdit());
-        if (m_domain->currentText() != m_page.Combo1.text)
-            m_domain->setEditText(m_page.Combo1.text);
-    }
+    m_domain->display(m_page.Combo1Items, m_page.Combo1Index, m_page.Combo1.text);
     m_at->setVisible(m_page.Text1.visible);
     const bool local = !m_page.Command8.visible && m_page.Command7.visible;
     setRole(m_withoutAddress, local ? "main" : "secondary");

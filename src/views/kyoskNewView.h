@@ -9,6 +9,7 @@ class QStackedLayout;
 
 namespace lumora {
 
+class EditableCombo;
 class LargePicture;
 class PictureCell;
 
@@ -66,7 +67,7 @@ private:
     QLabel* m_closingHead = nullptr;
     QLineEdit* m_mail = nullptr;
     QLabel* m_at = nullptr;
-    QComboBox* m_domain = nullptr;
+    EditableCombo* m_domain = nullptr;
     QLineEdit* m_albumMail = nullptr;
     QLineEdit* m_note = nullptr;
     QPushButton* m_withAddress = nullptr;

@@ -3,6 +3,7 @@
 #include "entry/TileMenu.h"
 #include "views/Cards.h"
 #include "views/Overlay.h"
+#include "views/nnnViewAlbum.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -33,6 +34,8 @@ nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     m_steps->addWidget(makeBorders());
     m_steps->addWidget(makeFit());
     m_steps->addWidget(makeTerms());
+    m_album = std::make_unique<Album>(*this);
+    m_steps->addWidget(m_album->widget());
     frame().content()->addWidget(content, 1);
     makeBars();
     bindHidden(u"Title"_s, page.Title);
@@ -44,6 +47,8 @@ nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     m_focusRequest = page.focusRequest;
     start();
 }
+
+nnnView::~nnnView() = default;
 
 QWidget* nnnView::makeMenu() {
     auto* menu = new QWidget(this);
@@ -288,7 +293,7 @@ void nnnView::makeBars() {
     m_toBorders = button(u"Command8"_s, m_page.Command8, Role::Main, [this] { m_page.Command8_Click(); });
     m_fromBorder = button(u"Command6"_s, m_page.Command6, Role::Main, [this] { m_page.Command6_Click(); });
     m_finish = button(u"Command3"_s, m_page.Command3, Role::Main, [this] { m_page.Command3_Click(); });
-    for (QPushButton* main : {m_toOptions, m_toBorders, m_fromBorder, m_finish})
+    for (QPushButton* main : QList{m_toOptions, m_toBorders, m_fromBorder, m_finish} + m_album->mainButtons())
         frame().addMainAction(main);
 
     m_clean = new Overlay(theme(), this);
@@ -319,6 +324,8 @@ QWidget* nnnView::firstFocus() const {
         return findChild<QWidget*>(u"Option4"_s);
     case nnn::Step::Terms:
         return findChild<QWidget*>(u"Check1"_s);
+    case nnn::Step::Album:
+        return m_album->firstFocus();
     }
     return nullptr;
 }
@@ -361,6 +368,7 @@ void nnnView::render() {
     const bool moved = m_shownStep != m_page.step;
     m_shownStep = m_page.step;
     m_steps->setCurrentIndex(static_cast<int>(m_page.step));
+    m_album->render();
     m_clean->setOpen(m_page.Frame1.visible);
     if (m_focusRequest != m_page.focusRequest) {
         m_focusRequest = m_page.focusRequest;

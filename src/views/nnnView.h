@@ -4,6 +4,7 @@
 #include "views/PageView.h"
 
 #include <array>
+#include <memory>
 
 class QFrame;
 class QGridLayout;
@@ -18,6 +19,7 @@ class nnnView : public PageView {
     Q_OBJECT
 public:
     nnnView(nnn& page, const SessionState& state, const Theme& theme);
+    ~nnnView() override;
     QWidget* firstFocus() const override;
     void escape() override;
 
@@ -25,6 +27,8 @@ protected:
     void render() override;
 
 private:
+    class Album;
+
     QWidget* makeMenu();
     QWidget* makeDetails();
     QWidget* makeOptions();
@@ -35,6 +39,7 @@ private:
     void placeTiles();
 
     nnn& m_page;
+    std::unique_ptr<Album> m_album;
     QStackedLayout* m_steps;
     std::array<Tile*, 10> m_tiles{};
     QGridLayout* m_tileGrid = nullptr;

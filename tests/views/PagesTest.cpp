@@ -12,6 +12,7 @@
 
 #include <gtest/gtest.h>
 
+#include <QTest>
 #include <QTimer>
 #include <QWidget>
 
@@ -216,6 +217,60 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     page.Command5_Click();
     EXPECT_TRUE(looked);
     walk.waitFor(u"FtpFrm"_s);
+}
+
+TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
+    Walk walk(GetParam().size, u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    walk.press(u"hatchala"_s, u"Image1"_s);
+    walk.waitFor(u"nnn"_s);
+    walk.press(u"nnn"_s, u"Image1(6)"_s);
+    const ControlFinder finder(walk.program().window());
+    const auto lookAtRest = [&](const QString& name) {
+        const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album;
+        EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }));
+        look(walk, name);
+    };
+    walk.type(u"nnn"_s, u"Text1(0)"_s, u"Studio Or"_s);
+    walk.type(u"nnn"_s, u"Text1(1)"_s, u"03-7654321"_s);
+    walk.type(u"nnn"_s, u"Text1(2)"_s, u"Wedding"_s);
+    walk.type(u"nnn"_s, u"Text1(3)"_s, u"studio"_s);
+    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Mail"_s, u"gmail.com"_s).ok());
+    lookAtRest(u"40-album-photographer"_s);
+    walk.press(u"nnn"_s, u"Command17"_s);
+    lookAtRest(u"41-album-kinds"_s);
+    walk.press(u"nnn"_s, u"SoogAlb(4)"_s);
+    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check4"_s, true).ok());
+    walk.press(u"nnn"_s, u"Command27"_s);
+    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Horim"_s, u"30/60"_s).ok());
+    lookAtRest(u"42-album-parents"_s);
+    walk.press(u"nnn"_s, u"Command16"_s);
+    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Godel"_s, u"30/60"_s).ok());
+    lookAtRest(u"43-album-size"_s);
+    walk.press(u"nnn"_s, u"Command18"_s);
+    walk.press(u"nnn"_s, u"Combo4Cricha(1)"_s);
+    lookAtRest(u"44-album-cover"_s);
+    walk.press(u"nnn"_s, u"Command19"_s);
+    walk.press(u"nnn"_s, u"Combo4Niyar(2)"_s);
+    lookAtRest(u"45-album-paper"_s);
+    walk.press(u"nnn"_s, u"Command20"_s);
+    walk.press(u"nnn"_s, u"Combo4Tosefet(1)"_s);
+    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check3(2)"_s, true).ok());
+    lookAtRest(u"46-album-extras"_s);
+    walk.press(u"nnn"_s, u"Command21"_s);
+    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check6"_s, true).ok());
+    lookAtRest(u"47-album-bill"_s);
+    walk.press(u"nnn"_s, u"Command22"_s);
+    walk.waitFor(u"kyoskNew"_s);
+    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    walk.press(u"kyoskNew"_s, u"Image5"_s);
+    walk.settle(300);
+    EXPECT_TRUE(walk.pressable(u"kyoskNew"_s, u"Image13"_s));
+    look(walk, u"48-album-pictures"_s);
+    walk.press(u"kyoskNew"_s, u"Command24"_s);
+    walk.press(u"kyoskNew"_s, u"Image7"_s);
+    look(walk, u"49-album-closing"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, PageLook,
