@@ -146,7 +146,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
                 name, caption, icon, narrow, [&page, down] { (page.*down)(); }, [&page, up] { (page.*up)(); }),
             row, at);
     };
-    move(u"Image125"_s, page.Image125, u"move-up"_s, &tFrmNew::Image125_MouseDown, &tFrmNew::Image125_MouseUp, 0, 1);
+    move(u"Image125"_s, page.Image125, u"arrow-up"_s, &tFrmNew::Image125_MouseDown, &tFrmNew::Image125_MouseUp, 0, 1);
     move(u"Image115"_s, page.Image115, u"arrow-left"_s, &tFrmNew::Image115_MouseDown, &tFrmNew::Image115_MouseUp, 1, 0);
     m_zoom = makeLabel(pad, "large");
     m_zoom->setAlignment(Qt::AlignCenter);
@@ -155,7 +155,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
     cross->addWidget(m_zoom, 1, 1);
     move(u"Image135"_s, page.Image135, u"arrow-right"_s, &tFrmNew::Image135_MouseDown, &tFrmNew::Image135_MouseUp, 1,
          2);
-    move(u"Image145"_s, page.Image145, u"move-down"_s, &tFrmNew::Image145_MouseDown, &tFrmNew::Image145_MouseUp, 2, 1);
+    move(u"Image145"_s, page.Image145, u"arrow-down"_s, &tFrmNew::Image145_MouseDown, &tFrmNew::Image145_MouseUp, 2, 1);
     for (int i = 0; i < 3; ++i)
         cross->setColumnStretch(i, 1);
     place->layout()->addWidget(pad);

@@ -2,6 +2,7 @@
 
 #include "editing/tFrmNew.h"
 #include "selection/kyoskNew.h"
+#include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "views/MainWindow.h"
 #include "views/PageView.h"
@@ -73,6 +74,17 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
     walk.press(editor, u"Image29"_s);
     look(walk, u"34-hints"_s);
     walk.press(editor, u"hintsClose"_s);
+    // The caption's keyboard lies below the picture, which stays whole and can be dragged.
+    walk.press(editor, u"Command8"_s);
+    walk.waitFor(u"mikledet"_s);
+    look(walk, u"37-caption"_s);
+    const auto* paper = walk.program().window().findChild<QWidget*>(u"PicPic"_s);
+    EXPECT_EQ(paper->visibleRegion().boundingRect(), paper->rect());
+    EXPECT_LT(paper->mapTo(&walk.program().window(), QPoint(0, paper->height())).y(),
+              walk.program().window().frontView()->y());
+    walk.program().chain().show(PageId::tFrmNew);
+    walk.settle(80);
+    EXPECT_TRUE(walk.pressable(editor, u"Image2(0)"_s));
     walk.press(editor, u"Strip(3)"_s);
     walk.settle(300);
     look(walk, u"35-other-picture"_s);
