@@ -150,7 +150,8 @@ void FrameThumbs::resizeEvent(QResizeEvent* event) {
 }
 
 void FrameThumbs::layOut() {
-    const int width = (viewport()->width() - 2) / across;
+    // Room for the scroll bar is kept also while there is none: it would come and go with the cells' own size.
+    const int width = (maximumViewportSize().width() - verticalScrollBar()->sizeHint().width() - 2) / across;
     const QSize cell(width, std::max(44, width * 2 / 3 + m_theme.px(6)));
     if (gridSize() == cell)
         return;
