@@ -29,6 +29,16 @@ const std::array<Field, 8>& textFields() {
     return fields;
 }
 
+// An album tells these under names of its own.
+const std::array<Field, 3>& albumFields() {
+    static const std::array<Field, 3> fields = {{
+        {QStringLiteral("ShemZalam"), &OrderDetails::n1},
+        {QStringLiteral("GodelLBM"), &OrderDetails::ppr},
+        {QStringLiteral("MailZalam"), &OrderDetails::Mail},
+    }};
+    return fields;
+}
+
 void setAll(OrderDetails& details, const QString& text) {
     for (const auto& [key, field] : textFields())
         details.*field = text;
@@ -57,6 +67,13 @@ void ReadOrderDetails(const Files& files, const QString& path, OrderDetails& det
             if (entry.key == key)
                 details.*field = entry.value;
         }
+        // What the session knows of a new album is more than its log tells: only gaps are filled.
+        for (const auto& [key, field] : albumFields()) {
+            if (entry.key == key && (details.*field).isEmpty())
+                details.*field = entry.value;
+        }
+        if (entry.key == QStringLiteral("TotalPics") && details.TotalPics == 0)
+            details.TotalPics = Val16(entry.value);
     }
 }
 

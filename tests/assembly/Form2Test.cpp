@@ -1,6 +1,8 @@
 #include "PlainOrder.h"
 
+#include "assembly/OrderCheck.h"
 #include "assembly/PaperResize.h"
+#include "common/AnsiCodePage.h"
 
 #include <QCoreApplication>
 #include <QCryptographicHash>
@@ -261,23 +263,140 @@ TEST_F(PreparingAPlainOrder, saysItsTextsInTheLanguageOfTheSession) {
     }
 }
 
-TEST_F(PreparingAPlainOrder, takesAnAlbumOrderThroughItsOwnSheetAndLog) {
-    state.Optint = 10;
-    state.shemot.ppr = QStringLiteral("30/60");
-    state.album.Tosafot1[0] = QStringLiteral("canvas");
-    state.album.Tosafot2[7] = QStringLiteral("gilt");
-    openWith({line(givePicture(QStringLiteral("one.jpg")))}).Command6_Click();
-    const QByteArray log = *machine.files.read(logPath());
-    EXPECT_TRUE(log.startsWith("\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"KeSherLaSharat\",\"0\"\r\n"));
-    EXPECT_TRUE(log.contains("\"SoogNiar\",\"\"\r\n\"Tosafot1_1\",\"canvas\"\r\n"));
-    EXPECT_TRUE(log.contains("\"Tosafot2_7\",\"\"\r\n\"Tosafot2_8\",\"gilt\"\r\n\"More Comp = \",0\r\n"));
-    EXPECT_EQ(log.count('\n'), 34 + 7 + 1);
-    EXPECT_EQ(printFiles(), QStringList(QStringLiteral("1 1015GNB0000_106F6E65.jpp")));
+class PreparingAnAlbum : public PreparingAPlainOrder {
+protected:
+    PreparingAnAlbum() {
+        state.Optint = 10;
+        state.DchisaAmoka = 1;
+        state.shemot.n1 = state.shemot.n2 = QString();
+        state.shemot.ppr = QStringLiteral("30/60");
+        state.shemot.maat = QStringLiteral("M");
+        state.shemot.FillFit = QStringLiteral("FFF");
+        AlbumDetails& album = state.album;
+        album.ShemZalam = QStringLiteral("סטודיו אור");
+        album.ShemErooa = QStringLiteral("Wedding");
+        album.TelZalam = QStringLiteral("03-7654321");
+        album.MailZalam = QStringLiteral("studio@example.com");
+        album.SoogLBM = QStringLiteral("פוטו גדול");
+        album.SoogKricha = QStringLiteral("חום");
+        album.SoogNiar = QStringLiteral("בחר סוג נייר");
+        album.Tosafot1[0] = QStringLiteral("קנבס");
+        album.Tosafot2 = {QStringLiteral("עוד=0"),          QStringLiteral("הטבעת שם בכריכה=0"),
+                          QStringLiteral("פינות עגולות=1"), QStringLiteral("מזוודה=0"),
+                          QStringLiteral("סובלימציה=0"),    QStringLiteral("פתיחה אנגלית=0")};
+        album.GodelLBM = QStringLiteral("30/60");
+        album.KamutHorim = QStringLiteral("2");
+        album.SoogHorim = QStringLiteral("30/60");
+    }
+    static QString albumLine(const QString& path, const QString& copies = QStringLiteral("1 ")) {
+        return copies + QStringLiteral("3060MNB") + path;
+    }
+};
+
+TEST_F(PreparingAnAlbum, writesTheLogThatTheLabExpectsToTheByte) {
+    openWith({albumLine(givePicture(QStringLiteral("one.jpg")), QStringLiteral("2 ")),
+              albumLine(givePicture(QStringLiteral("two.jpg")))})
+        .Command6_Click();
+    QString wanted = QStringLiteral(R"("00","00"
+"00","00"
+"KeSherLaSharat","0"
+"HitKasherDerech",""
+"TaooyotBaHaShvaa",0
+"------------","---------"
+"Girsa","4.00"
+"Time",#2026-11-21 14:05:09#
+"Hazmana","2026_11_21_KUP_1234^105"
+"Optint",10
+"ser","1234"
+"TotalPics",3
+"GodelLBM","30/60"
+"Hearot",""
+"MailZalam","studio@example.com"
+"ShemErooa","Wedding"
+"ShemZalam","סטודיו אור"
+"SoogKricha","חום"
+"SoogLBM","פוטו גדול"
+"SoogNiar","בחר סוג נייר"
+"Tosafot1_1","קנבס"
+"Tosafot1_2",""
+"Tosafot1_3",""
+"Tosafot1_4",""
+"Tosafot2_1","עוד=0"
+"Tosafot2_2","הטבעת שם בכריכה=0"
+"Tosafot2_3","פינות עגולות=1"
+"Tosafot2_4","מזוודה=0"
+"Tosafot2_5","סובלימציה=0"
+"Tosafot2_6","פתיחה אנגלית=0"
+"Tosafot2_7",""
+"Tosafot2_8",""
+"More Comp = ",1
+"***","*********************************************"
+"-----------Total Failed","0-----------"
+" "
+" "
+"-----------End","Of Failed List-------------"
+" "
+"-----------","------------------------------"
+" "
+"Shoora","2 3060MNBC:\pics\one.jpg"
+"Shoora","1 3060MNBC:\pics\two.jpg"
+)");
+    wanted.replace(QStringLiteral("\n"), QStringLiteral("\r\n"));
+    EXPECT_EQ(AnsiCodePage::decode(*machine.files.read(logPath())), wanted);
+    EXPECT_EQ(machine.files.read(logPath())->size(), wanted.size()) << "a byte a character";
+    EXPECT_EQ(printFiles(), QStringList({QStringLiteral("1 3060MNB0001_1074776F.jpp"),
+                                         QStringLiteral("2 3060MNB0000_106F6E65.jpp")}));
+}
+
+TEST_F(PreparingAnAlbum, drawsItsOwnSheetWithTheContactSheetBelow) {
+    openWith({albumLine(givePicture(QStringLiteral("one.jpg")))}).Command6_Click();
     const Result<Bitmap> sheet = loadPicture(*machine.drives.toHost(folder() + QStringLiteral("\\!105_1234.jpp")));
     ASSERT_TRUE(sheet);
-    const QColor background = sheet->image().pixelColor(490, 470);
-    EXPECT_NEAR(background.red(), 220, 3);
-    EXPECT_NEAR(background.blue(), 150, 3);
+    const auto near = [&](QPoint at, QColor wanted) {
+        const QColor found = sheet->image().pixelColor(at);
+        EXPECT_NEAR(found.red(), wanted.red(), 8);
+        EXPECT_NEAR(found.green(), wanted.green(), 8);
+        EXPECT_NEAR(found.blue(), wanted.blue(), 8);
+    };
+    near({490, 470}, {220, 220, 150});
+    near({5 + 40, 80 + 282 + 30}, Qt::red); // row 1, column 0: the picture
+    near({5 + 2 * 82 + 40, 80 + 282 + 30}, {220, 220, 150});
+}
+
+TEST_F(PreparingAnAlbum, sizesItsPicturesToTheAlbumUnlessTheyAreCompressedDeeply) {
+    for (const int deep : {0, 1}) {
+        state.DchisaAmoka = static_cast<std::int16_t>(deep);
+        state.shemot.ppr = QStringLiteral("02/04");
+        const QString source = givePicture(QStringLiteral("one.jpg"), 960, 640);
+        openWith({albumLine(source)}).Command6_Click();
+        const Result<PrintFileContent> print = unpacked(QStringLiteral("1 3060MNB0000_106F6E65.jpp"));
+        ASSERT_TRUE(print);
+        giveFile(QStringLiteral("print.jpg"), print->picture);
+        EXPECT_EQ(*readPictureSize(*machine.drives.toHost(QStringLiteral("C:\\pics\\print.jpg"))),
+                  deep == 1 ? (PictureSize{960, 640}) : (PictureSize{480, 320}));
+        EXPECT_EQ(print->tail, "1 1                     1  1051234      ") << "the customer's fields are empty";
+        std::filesystem::remove_all(*machine.drives.toHost(folder()));
+        chain.unload(PageId::FtpFrm);
+        state.MisparHazmana = QStringLiteral("105");
+    }
+}
+
+TEST_F(PreparingAnAlbum, holdsTogetherForWhoReadsTheFolder) {
+    state.DchisaAmoka = 0; // a copied file is not looked at
+    for (const int marked : {0, 1}) {
+        state.transfer.HazmanaP = static_cast<std::int16_t>(marked);
+        const QString number = marked == 1 ? QStringLiteral("105P") : QStringLiteral("105");
+        openWith({albumLine(givePicture(QStringLiteral("one.jpg")), QStringLiteral("2 ")),
+                  albumLine(giveFile(QStringLiteral("bad.jpg"), "no picture"))})
+            .Command6_Click();
+        EXPECT_TRUE(machine.files.read(logPath(number))->contains("KUP_1234^105\"")) << "never with the P";
+        chain.unload(PageId::FtpFrm);
+        const Result<OrderFindings> report =
+            checkOrderFolder(*machine.drives.toHost(folder(number)), PrintFileShape::of(state.profile));
+        ASSERT_TRUE(report);
+        EXPECT_EQ(report->faults.join(u'|'), QString());
+        EXPECT_EQ(report->copies, 3);
+    }
 }
 
 } // namespace

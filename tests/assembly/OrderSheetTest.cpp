@@ -71,20 +71,44 @@ TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
 
 TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
     SessionState state = sessionOfTheExample();
-    state.album.ShemErooa = QStringLiteral("Wedding");
-    for (std::size_t i = 0; i < state.album.Tosafot2.size(); ++i)
-        state.album.Tosafot2[i] = QString::number(i);
-    state.album.KamutHorim = QStringLiteral("2");
-    state.album.SoogHorim = QStringLiteral("30/60");
-    const QStringList lines = albumSheetLines(state, FixedClock().now());
-    EXPECT_EQ(lines.size(), 17) << "the event and the address share a line";
-    EXPECT_EQ(lines[2], QStringLiteral("  ShemErooa....Wedding    Herzl 1      "));
-    EXPECT_EQ(lines[5], QString(89, u'-'));
-    EXPECT_EQ(lines[9], QStringLiteral(" 0       1       2       3  "));
-    EXPECT_EQ(lines[10], QStringLiteral(" 4       5       6       7       8     "));
-    EXPECT_EQ(lines[12], QStringLiteral(" 2  אלבום הורים  "));
-    EXPECT_EQ(lines[13], QStringLiteral("   סוג  אלבום  הורים  30/60   "));
+    AlbumDetails& album = state.album;
+    album.ShemZalam = QStringLiteral("Studio Or");
+    album.TelZalam = QStringLiteral("03-7654321");
+    album.ShemErooa = QStringLiteral("Wedding");
+    album.MailZalam = QStringLiteral("studio@example.com");
+    album.GodelLBM = QStringLiteral("30/60");
+    album.SoogLBM = QStringLiteral("פוטו גדול");
+    album.SoogNiar = QStringLiteral("משי");
+    album.SoogKricha = QStringLiteral("חום");
+    for (std::size_t i = 0; i < album.Tosafot2.size(); ++i)
+        album.Tosafot2[i] = QString::number(i);
+    album.KamutHorim = QStringLiteral("2");
+    album.SoogHorim = QStringLiteral("30/60");
+    const QString rule(89, u'-');
+    // The event and the address share a line.
+    EXPECT_EQ(albumSheetLines(state, FixedClock().now()),
+              (QStringList{
+                  QStringLiteral("No.....105_1234    21/11/2026 14:05:09      ver: 4.00"),
+                  QStringLiteral("  ShemZalam....Studio Or        TelZalam.....03-7654321      "),
+                  QStringLiteral("  ShemErooa....Wedding    Herzl 1      "),
+                  QStringLiteral("  MailZalam....studio@example.com"),
+                  QStringLiteral("  Total pictures...13"),
+                  rule,
+                  QStringLiteral("  GodelLBM....30/60       SoogLBM....פוטו גדול     SoogNiar....משי"),
+                  QStringLiteral("  SoogKricha....חום"),
+                  rule,
+                  QStringLiteral(" 0       1       2       3  "),
+                  QStringLiteral(" 4       5       6       7       8     "),
+                  rule,
+                  QStringLiteral(" 2  אלבום הורים  "),
+                  QStringLiteral("   סוג  אלבום  הורים  30/60   "),
+                  rule,
+                  QStringLiteral("  Hearot....gift - "),
+                  rule,
+              }));
     EXPECT_EQ(orderSheetBackground(SheetKind::Album, state), QColor(220, 220, 150));
+    state.shemot.ppr = QStringLiteral("zz/zz");
+    EXPECT_EQ(orderSheetBackground(SheetKind::Album, state), QColor(255, 192, 255));
 }
 
 TEST(OrderSheet, growsWithTheOrder) {

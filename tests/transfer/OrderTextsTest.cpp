@@ -86,6 +86,22 @@ TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
     EXPECT_EQ(details.TotalPics, 13);
 }
 
+TEST(ReadOrderDetails, FillsTheGapsFromTheLogOfAnAlbum) {
+    TestPlatform test;
+    const QString path = QStringLiteral("C:\\log.txt");
+    (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
+                                      "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
+    OrderDetails details; // as a resend clears it
+    ReadOrderDetails(test.files, path, details);
+    EXPECT_EQ(details.n1, QStringLiteral("Studio Or"));
+    EXPECT_EQ(details.ppr, QStringLiteral("30/60"));
+    EXPECT_EQ(details.Mail, QStringLiteral("studio@example.com"));
+    EXPECT_EQ(details.TotalPics, 14);
+    details.Mail = QStringLiteral("as corrected@example.com");
+    ReadOrderDetails(test.files, path, details);
+    EXPECT_EQ(details.Mail, QStringLiteral("as corrected@example.com"));
+}
+
 TEST(ReadOrderDetails, SaysSoWhenThereIsNoLog) {
     TestPlatform test;
     OrderDetails details;
