@@ -259,6 +259,31 @@ TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
     EXPECT_EQ(shownCells(page), 12);
 }
 
+TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
+    state.Optint = 10;
+    state.shemot.ppr = QStringLiteral("30/60");
+    state.shemot.maat = QStringLiteral("M");
+    state.album.MailZalam = QStringLiteral("studio@example.com");
+    kyoskNew& page = openWith(3);
+    ASSERT_TRUE(page.Picture66.visible);
+    EXPECT_TRUE(page.Image13.visible);
+    EXPECT_FALSE(page.Image7.visible);
+    page.Image13_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא נבחרו תמונות")));
+    EXPECT_EQ(page.Txt4Ml2.text, QStringLiteral("studio@example.com"));
+    page.Command24_Click();
+    EXPECT_FALSE(page.Image13.visible);
+    EXPECT_TRUE(page.Image7.visible) << "there is always a way to finish";
+    page.Image7_Click();
+    page.Txt4Ml2_Change(QStringLiteral("other@example.com"));
+    page.Command8_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::Form2);
+    EXPECT_EQ(state.shemot.Mail, QStringLiteral("other@example.com"));
+    EXPECT_EQ(state.DchisaAmoka, 1);
+    EXPECT_TRUE(state.handOver.pressStart);
+    EXPECT_EQ(state.handOver.lines.value(0), QStringLiteral("1 3060MNB") + first);
+}
+
 TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
     state.Optint = 2;
     kyoskNew& page = openWith(3);
