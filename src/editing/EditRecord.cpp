@@ -3,6 +3,8 @@
 #include "common/FixedText.h"
 #include "session/SessionState.h"
 
+#include <QRegularExpression>
+
 #include <algorithm>
 
 namespace lumora {
@@ -34,6 +36,16 @@ QString stored(Column column, const QString& text) {
 
 } // namespace EditRecord
 
+namespace {
+
+// A digit comes first, a sign and a point at most before it.
+bool beginsWithNumber(const QString& field) {
+    static const QRegularExpression number(QStringLiteral("^[+-]? *\\.?[0-9]"));
+    return number.match(field).hasMatch();
+}
+
+} // namespace
+
 void UnpackEditState(const QString& record, EditFields& fields) {
     namespace R = EditRecord;
     fields.EditState = LeftField(record, R::width);
@@ -43,10 +55,8 @@ void UnpackEditState(const QString& record, EditFields& fields) {
     // Where a damaged record has letters for a number the picture stays without that edit: read as 0 they would print
     // it black, or shrunk to nothing.
     const auto unlessLetters = [&](R::Column column, double without) {
-        const QString field = text(column);
-        const bool letters =
-            !field.trimmed().isEmpty() && std::none_of(field.begin(), field.end(), [](QChar c) { return c.isDigit(); });
-        return letters ? without : Val(field);
+        const QString field = text(column).trimmed();
+        return field.isEmpty() || beginsWithNumber(field) ? Val(field) : without;
     };
     const auto placed = [&](R::Column column, std::int16_t without) {
         return unlessLetters(column, without) == without ? without : number(column);

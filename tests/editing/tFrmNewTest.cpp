@@ -418,11 +418,13 @@ TEST_F(TheEditor, readsBadRecordsAsThePictureWithoutThatEdit) {
     for (const Case& c :
          {Case{EditRecord::ZoomPercent, "xx"}, Case{EditRecord::ZoomPercent, "999"}, Case{EditRecord::PanX, "ab"},
           Case{EditRecord::RotationCode, "?"}, Case{EditRecord::FrameFolder, ".."},
-          Case{EditRecord::FrameFolder, "\\p"}, Case{EditRecord::ToneFlag, "x"}, Case{EditRecord::GainG, "eee"}}) {
+          Case{EditRecord::FrameFolder, "\\p"}, Case{EditRecord::ToneFlag, "x"}, Case{EditRecord::GainG, "eee"},
+          Case{EditRecord::GainR, "x1"}, Case{EditRecord::ZoomPercent, "o8"}, Case{EditRecord::GainB, "-.x"}}) {
         tFrmNew& editor =
             open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, QStringLiteral("003")));
         EXPECT_TRUE(editor.pictureOpen()) << c.value;
         EXPECT_LT(corner().green(), 100) << c.value;
+        EXPECT_GT(middle().red(), 200) << c.value;
     }
     EXPECT_TRUE(machine.dialogs.messages.isEmpty());
 }
