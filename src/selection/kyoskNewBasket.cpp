@@ -111,7 +111,13 @@ void kyoskNew::openInEditor(int cell) {
     m_chain.show(PageId::tFrmNew);
 }
 
+// What is in hand is let go and packed before another picture's fields take the place of these: a zoom that is still
+// held, a caption that was dragged and, by its own rule, not packed. What was seen is what prints.
 void kyoskNew::leaveEditor() {
+    if (editor() != nullptr) {
+        editor()->stopHolds();
+        editor()->Command5_Click();
+    }
     Command5_Click();
     repaintStored(m_state.edit.PicturePath);
     Q_EMIT changed();
@@ -138,6 +144,8 @@ void kyoskNew::setCopies(int cell, int copies) {
         Picture4[at].visible = false;
         if (Command13[at].colour == KeyColour::Orange)
             editorView.visible = false;
+        if (!plain() && index >= 0)
+            repaintStored(path); // as the file is: chosen again it begins without its edits
     } else {
         // The rest of a line stays, edits included.
         if (index >= 0)

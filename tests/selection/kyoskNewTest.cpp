@@ -337,11 +337,55 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
     EXPECT_LT(redAt(0), 100);
     EXPECT_GT(redAt(1), 200);
 
+    // Taken out of the basket it shows as its file is, and so it stays when it is chosen anew.
     page.Command13_Click(0);
+    EXPECT_GT(redAt(0), 200);
     page.Picture1_Click(0);
     EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    EXPECT_GT(redAt(0), 200);
     page.Command13_Click(0);
     EXPECT_FALSE(page.editorView.visible);
+}
+
+TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
+    state.Optint = 2;
+    registerEditor();
+    kyoskNew& page = openWith(2);
+    const auto field = [&page](EditRecord::Column column) {
+        return page.List1.item(0).mid(9 + column.position - 1, column.width);
+    };
+    // A second finger on another picture while the zoom is still held.
+    page.Picture1_Click(0);
+    editor().Image2_MouseDown(0);
+    editor().Timer2_Tick();
+    page.Picture1_Click(1);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("102"));
+    EXPECT_EQ(state.edit.ZoomPercent, 100);
+
+    // Another picture that comes while the release of the zoom lets events through.
+    page.Picture1_Click(0);
+    editor().Image2_MouseDown(0);
+    editor().Timer2_Tick();
+    machine.pump.onPump = [&] {
+        machine.pump.onPump = nullptr;
+        page.Picture1_Click(1);
+    };
+    editor().Image2_MouseUp(0);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("104"));
+    EXPECT_EQ(page.List1.item(1).mid(9 + 15, 3), QStringLiteral("100"));
+
+    // A caption that was dragged, which does not pack by itself.
+    page.Picture1_Click(0);
+    state.edit.TextOn = 1;
+    state.edit.TextBody = QStringLiteral("abc");
+    editor().Command11_Click();
+    editor().Labeltext_MouseDown({0, 0});
+    editor().Labeltext_MouseMove({130, 260});
+    editor().Labeltext_MouseUp();
+    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("0  "));
+    editor().CommandDone_Click();
+    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("10 "));
+    EXPECT_EQ(field(EditRecord::TextY), QStringLiteral("20 "));
 }
 
 TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
