@@ -12,16 +12,14 @@
 #include "session/SettingsText.h"
 #include "session/Workspace.h"
 
+#include <QUrl>
+
 namespace lumora {
 
 namespace {
 
 // A settings text is one line; what a stranger's server sends in its place may be anything.
 constexpr qint64 largestSettingsFile = 1 << 16;
-
-constexpr int panelWidth = 230;
-constexpr int arrowTop = 400;
-constexpr int arrowBottom = 430;
 
 } // namespace
 
@@ -65,7 +63,8 @@ void hatchala::setTexts() {
     Image1.text = s.wording(QStringLiteral("התחל"), QStringLiteral("Start"));
     Image11.text = s.wording(QStringLiteral("מחירון"), QStringLiteral("Price list"));
     Image5.text = s.wording(QStringLiteral("לאתר שלנו"), QStringLiteral("Our site"));
-    Image8.text = Image5.text;
+    Image8.text = QUrl(s.profile.SiteUrl).host();
+    Image6.text = s.wording(QStringLiteral("יצירת קשר עם המעבדה"), QStringLiteral("Reach the lab"));
     Image3.text = s.wording(QStringLiteral("יציאה"), QStringLiteral("Exit"));
     Image1.hint = s.wording({}, QStringLiteral("Start Button"));
     Image11.hint = s.wording({}, QStringLiteral("Navigate to Price List Page on the web"));
@@ -77,9 +76,10 @@ void hatchala::setTexts() {
     Label3.visible = s.english();
     Label4.visible = s.english();
     Picture3.text =
-        s.wording({}, QStringLiteral(" please select \n Wher do you want \n to recieve the \n Printed Pictures "));
-    List1Caption.text = s.wording(QStringLiteral("היכן תרצו לקבל את התמונות?"),
-                                  QStringLiteral("Where do you want to receive the printed pictures?"));
+        s.wording(QStringLiteral("מה עושה הכפתור?"),
+                  QStringLiteral(" please select \n Wher do you want \n to recieve the \n Printed Pictures "));
+    List1Caption.text = s.wording(QStringLiteral("היכן תרצו לקבל את התמונות?"), Picture3.text);
+    setHelp();
     Label7.text = s.wording(QStringLiteral("מיד מתחילים"), QStringLiteral("Starting right away"));
     Label8.text = QStringLiteral("V  V  V");
     Command1.text = s.wording(QStringLiteral("משלוח"), QStringLiteral("Sending"));
@@ -102,7 +102,23 @@ void hatchala::setTexts() {
     Q_EMIT changed();
 }
 
+void hatchala::setHelp() {
+    const auto help = [this](Hover over, const QString& hebrew, const QString& english) {
+        Image12[static_cast<std::size_t>(over)].text = m_state.wording(hebrew, english);
+    };
+    help(Hover::Image1, QStringLiteral("מתחילים הזמנה חדשה: פרטים, תמונות ומשלוח למעבדה"),
+         QStringLiteral("Begins a new order: your details, your pictures, and off to the lab"));
+    help(Hover::Image11, QStringLiteral("מציג את מחירי ההדפסה באתר שלנו"),
+         QStringLiteral("Shows the prices of prints on our web site"));
+    help(Hover::Image5, QStringLiteral("פותח את אתר האינטרנט שלנו"), QStringLiteral("Opens our web site"));
+    help(Hover::Image3, QStringLiteral("סוגר את התוכנה. דבר אינו נשלח"),
+         QStringLiteral("Ends the program. Nothing is sent"));
+    help(Hover::Image6, QStringLiteral("יש שאלה? נשמח לעזור בטלפון או בדואר אלקטרוני"),
+         QStringLiteral("Any question? We are glad to help, by telephone or by e-mail"));
+}
+
 void hatchala::Check1_Click(bool checked) {
+    MouseMove(Hover::Nothing);
     Check1.checked = checked;
     m_state.EnglishTips = checked ? 1 : 0;
     List1.clear();
@@ -112,9 +128,6 @@ void hatchala::Check1_Click(bool checked) {
 // --- the ways on ---
 
 void hatchala::Image1_MouseDown() {
-    if (m_leaving)
-        return;
-    pressed = Hover::Image1;
     startWith(QStringLiteral("KUP"));
     Q_EMIT changed();
 }
@@ -132,8 +145,7 @@ void hatchala::startWith(const QString& code) {
     Timer2.stop();
     m_state.MishloachHabaita = false;
     if (m_state.DeliveryChoiceMode == 1) {
-        if (List1.currentIndex() >= 0)
-            handOver();
+        Command2_Click(); // does nothing as long as no shop is chosen
         return;
     }
     loadProfile();
@@ -145,7 +157,6 @@ void hatchala::startWith(const QString& code) {
 
 // Comes only when the press left the page open: the question of the shop is still to be answered.
 void hatchala::Image1_Click() {
-    pressed = Hover::Nothing;
     if (m_leaving || m_state.DeliveryChoiceMode != 1)
         return;
     Picture1Width = 5;
@@ -153,6 +164,16 @@ void hatchala::Image1_Click() {
     Timer3.start();
     Timer5.stop();
     m_state.KodMishloach = QStringLiteral("KUP");
+    Q_EMIT changed();
+}
+
+void hatchala::Picture1_Escape() {
+    if (m_leaving)
+        return;
+    Timer3.stop();
+    Picture1.visible = false;
+    Timer2.start();
+    Timer5.start();
     Q_EMIT changed();
 }
 
@@ -168,12 +189,16 @@ void hatchala::Command2_Click() {
     if (m_leaving || row < 0 || row >= static_cast<int>(m_state.profile.Shops.size()))
         return;
     loadProfile();
-    m_state.profile.LabPhone = m_state.profile.Shops[static_cast<std::size_t>(row)].phone;
+    const QString phone = m_state.profile.Shops[static_cast<std::size_t>(row)].phone;
+    // The details page loads with the lab's own number for the first shop and with the shop's for the second.
+    if (row == 1)
+        m_state.profile.LabPhone = phone;
     m_state.MishloachHabaita = false;
     m_state.KodMishloach = row == 0 ? QStringLiteral("SOK") : QStringLiteral("OSK");
     m_state.KodMishloachMakor = m_state.KodMishloach;
     m_state.shemot.Mail.clear();
     handOver();
+    m_state.profile.LabPhone = phone;
 }
 
 void hatchala::handOver() {
@@ -208,6 +233,9 @@ void hatchala::Image8_Click() {
 }
 
 void hatchala::MouseMove(Hover over) {
+    if (over == m_over)
+        return;
+    m_over = over;
     for (std::size_t i = 0; i < Image12.size(); ++i)
         Image12[i].visible = over != Hover::Nothing && static_cast<std::size_t>(over) == i;
     // In English the place of these pictures is taken by words.
@@ -241,13 +269,17 @@ void hatchala::Timer2_Tick() {
         return;
     }
     Timer2.setInterval(30);
-    if (Picture4Width >= 265)
+    // One that the installation placed there needs no fetch.
+    if (Picture4.isEmpty()) {
+        Picture4 = m_state.profile.AdFile1;
+        Q_EMIT changed();
+    }
+    if (Picture4Width >= pictureWidth)
         m_pictureStep = -1;
     Picture4Width += m_pictureStep;
     if (Picture4Width < 5)
         m_pictureStep = 1;
-    if (m_pictureStep != 0)
-        Q_EMIT changed();
+    Q_EMIT moved();
 }
 
 void hatchala::Timer3_Tick() {
@@ -255,7 +287,7 @@ void hatchala::Timer3_Tick() {
         Picture1Width += 5;
     else
         Timer3.stop();
-    Q_EMIT changed();
+    Q_EMIT moved();
 }
 
 void hatchala::Timer4_Tick() {
@@ -276,7 +308,7 @@ void hatchala::Timer5_Tick() {
     if (Label8Top >= arrowBottom)
         Label8Top = arrowTop;
     ++Label8Top;
-    // Not told: the page may wait for hours, and a rendering for each of these ticks would keep the machine busy.
+    Q_EMIT moved();
 }
 
 // --- the profile and its service panel ---

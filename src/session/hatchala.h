@@ -40,8 +40,10 @@ public:
     void Command1_Click();
     void Command2_Click();
 
+    // Where the mouse, a finger or the keyboard is; what has no help counts as the bare page.
     enum class Hover { Nothing, Image1, Image11, Image5, Image3, Image6 };
     void MouseMove(Hover over);
+    void Picture1_Escape(); // the question of the shop is put off: the page waits as before
 
     void Timer1_Tick();
     void Timer2_Tick();
@@ -72,32 +74,36 @@ public:
     Caption Notice; // a line left by the page before, such as the number of an order that stays here; hidden when there
                     // is none
     Caption Image1; // start
-    Caption Image11; // price list
-    Caption Image5;  // site
-    Caption Image8;
+    Caption Image11;     // price list
+    Caption Image5;      // site
+    Caption Image8;      // the site's own name
+    Caption Image6;      // how to reach the lab
     Caption Image3;      // exit
     CheckCaption Check1; // "English Tips"
     Caption Label1;      // the lab's mail address
     Caption Label4Tel;   // the lab's telephone
     Caption Label4Tel2;
-    Caption Label4Zel;     // the shadow of Label4Tel
-    Caption Label3;        // what the button for the site does, in English
-    Caption Label4;        // what the exit does, in English
-    Caption Label6;        // the countdown's number
-    Caption Label7;        // the countdown's text
-    Caption Label8;        // the arrow that moves above the start button
-    int Label8Top = 400;   // 400 to 430; moves without a changed()
-    Caption Picture1;      // the panel with List1
-    int Picture1Width = 0; // grows to 230
+    Caption Label4Zel; // the shadow of Label4Tel
+    Caption Label3;    // what the button for the site does, in English
+    Caption Label4;    // what the exit does, in English
+    Caption Label6;    // the countdown's number
+    Caption Label7;    // the countdown's text
+    Caption Label8;    // the arrow that moves above the start button
+    static constexpr int arrowTop = 400;
+    static constexpr int arrowBottom = 430;
+    int Label8Top = arrowTop;
+    Caption Picture1; // the panel with List1
+    static constexpr int panelWidth = 230;
+    int Picture1Width = 0; // grows to panelWidth
     Caption List1Caption;  // what is asked
     TextList List1;        // where the prints are fetched; row 0 is always the first shop
     Caption Picture2;      // decoration that gives way to the help picture
-    Caption Picture3;      // the question, above the help picture
+    Caption Picture3;      // the line above a help picture; in English the question of the shop
     Caption Image2;
     std::array<Caption, 6> Image12; // help pictures by Hover, index 0 unused
-    Hover pressed = Hover::Nothing; // the button that looks sunken
     QString Picture4;               // drive path of the advertising picture; empty when there is none
-    int Picture4Width = 100;
+    static constexpr int pictureWidth = 265;
+    int Picture4Width = pictureWidth; // 4 to pictureWidth
     Caption Command1;
     Caption Command2;
 
@@ -119,9 +125,15 @@ public:
     Ticker Timer4; // countdown to the automatic start; no step starts it
     Ticker Timer5; // moves the arrow
 
+Q_SIGNALS:
+    // Label8Top, Picture1Width or Picture4Width has moved by a step: dozens of times a second, so that a view moves
+    // just that piece. The page may wait for hours.
+    void moved();
+
 private:
     void loadProfile();
     void showProfile();
+    void setHelp();
     void startWith(const QString& code);
     void handOver();
     QString settingsFile() const;
@@ -130,7 +142,8 @@ private:
     const Platform& m_platform;
     PageChain& m_chain;
     const Deployment& m_deployment;
-    int m_pictureStep = 0; // nothing moves until the picture has once been at a limit
+    int m_pictureStep = 0; // the picture moves once it has been at a limit
+    Hover m_over = Hover::Nothing;
     bool m_leaving = false;
 };
 

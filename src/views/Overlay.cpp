@@ -55,6 +55,23 @@ void Overlay::setOpen(bool open) {
     }
 }
 
+void Overlay::setReveal(double share) {
+    share = std::min(share, 1.0);
+    if (m_reveal == share)
+        return;
+    m_reveal = share;
+    cutCard();
+}
+
+void Overlay::cutCard() {
+    if (m_reveal >= 1) {
+        m_card->clearMask();
+        return;
+    }
+    const int open = static_cast<int>(m_card->width() * m_reveal);
+    m_card->setMask(QRegion((m_card->width() - open) / 2, 0, open, m_card->height()));
+}
+
 void Overlay::place() {
     const int room = m_theme.px(24);
     const QSize available = size() - QSize(2 * room, 2 * room);
@@ -68,6 +85,7 @@ void Overlay::place() {
     }
     m_card->setGeometry((width() - wanted.width()) / 2, (height() - wanted.height()) / 2, wanted.width(),
                         wanted.height());
+    cutCard();
 }
 
 bool Overlay::eventFilter(QObject* watched, QEvent* event) {

@@ -20,6 +20,8 @@ public:
 
     void setOpen(bool open);
     bool isOpen() const { return m_open; }
+    // How much of the card's width is unfolded, from 0 to 1. The rest of the card neither shows nor answers.
+    void setReveal(double share);
     QVBoxLayout* column() const { return m_column; }
     QFrame* card() const { return m_card; }
     // Of a 1024 by 768 window.
@@ -43,6 +45,7 @@ protected:
 
 private:
     void place();
+    void cutCard();
 
     const Theme& m_theme;
     QFrame* m_card;
@@ -50,6 +53,7 @@ private:
     QPointer<QWidget> m_firstFocus;
     QPointer<QWidget> m_before;
     double m_width = 620;
+    double m_reveal = 1;
     bool m_filling = false;
     bool m_open = false;
 };

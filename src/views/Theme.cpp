@@ -132,6 +132,8 @@ QPushButton[role="quiet"]:hover { background: $Sunken; }
 QPushButton[role="danger"] { border-color: $Danger; color: $Danger; }
 QPushButton[role="danger"]:hover { background: $DangerSoft; border-color: $Danger; }
 QPushButton[role="danger"]:disabled { border-color: $Line; color: $Muted; }
+QPushButton[sinks="true"]:pressed { border: 2px inset $Edge; background: $Sunken; }
+QPushButton[role="main"][sinks="true"]:pressed { border: 3px inset $Primary; background: $PrimaryDark; }
 QPushButton[role="tall"] { min-height: @52px; padding: 0 @8px; font-size: @15px; }
 QPushButton[role="tool"] { padding: 0; min-width: 44px; min-height: 44px; border: none; }
 QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }

@@ -114,11 +114,18 @@ TEST_F(hatchalaTest, TheCountdownStartsByItself) {
 
 TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
     deployment.DeliveryChoiceMode = 1;
+    deployment.profile.LabPhone = QStringLiteral("09-9");
+    QString seenByTheDetails;
+    chain.registerPage(PageId::nnn, [&] {
+        seenByTheDetails = state.profile.LabPhone;
+        return std::make_unique<Page>(PageId::nnn);
+    });
     const struct {
         int row;
         QString code;
         QString phone;
-    } cases[] = {{0, "SOK", "04-1"}, {1, "OSK", "03-2"}};
+        QString seen; // the first shop's number comes behind the hand-over
+    } cases[] = {{0, "SOK", "04-1", "09-9"}, {1, "OSK", "03-2", "03-2"}};
     for (const auto& c : cases) {
         hatchala& page = start();
         page.Image1_MouseDown();
@@ -126,16 +133,46 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
         page.Image1_Click();
         EXPECT_TRUE(page.Picture1.visible && page.Timer3.running());
         EXPECT_FALSE(page.Timer5.running());
+        EXPECT_EQ(state.KodMishloach, u"KUP");
         for (int tick = 0; tick < 100; ++tick)
             page.Timer3_Tick();
         EXPECT_EQ(page.Picture1Width, 230);
         EXPECT_FALSE(page.Timer3.running());
+        state.MishloachHabaita = true;
+        state.shemot.Mail = QStringLiteral("earlier@example.com");
         page.List1_Click(c.row);
         ASSERT_EQ(chain.front()->id(), PageId::nnn);
         EXPECT_EQ(state.KodMishloach, c.code);
+        EXPECT_EQ(state.KodMishloachMakor, c.code);
         EXPECT_EQ(state.profile.LabPhone, c.phone);
+        EXPECT_EQ(seenByTheDetails, c.seen);
+        EXPECT_FALSE(state.MishloachHabaita);
+        EXPECT_TRUE(state.shemot.Mail.isEmpty());
         chain.unload(PageId::nnn);
     }
+}
+
+TEST_F(hatchalaTest, APressWithAShopChosenStartsWithTheShop) {
+    deployment.DeliveryChoiceMode = 1;
+    hatchala& page = start();
+    page.List1.setCurrentIndex(1);
+    page.Image1_MouseDown();
+    ASSERT_EQ(chain.front()->id(), PageId::nnn);
+    EXPECT_EQ(state.KodMishloach, u"OSK");
+    EXPECT_EQ(state.profile.LabPhone, u"03-2");
+}
+
+TEST_F(hatchalaTest, TheQuestionOfTheShopCanBePutOff) {
+    deployment.DeliveryChoiceMode = 1;
+    hatchala& page = start();
+    page.Image1_MouseDown();
+    page.Image1_Click();
+    page.Picture1_Escape();
+    EXPECT_FALSE(page.Picture1.visible || page.Timer3.running());
+    EXPECT_TRUE(page.Timer5.running());
+    page.Image1_MouseDown();
+    page.Image1_Click();
+    EXPECT_TRUE(page.Picture1.visible && page.Timer3.running());
 }
 
 TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
@@ -159,6 +196,7 @@ TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
     EXPECT_EQ(site.urls, QStringList({"http://www.lumora.example//ad01.jpg"}));
     EXPECT_EQ(page.Picture4, state.profile.AdFile1);
     EXPECT_TRUE(page.Timer2.running());
+    page.Picture4Width = 100;
     page.Timer2_Tick();
     EXPECT_EQ(page.Timer2.interval(), 30);
     EXPECT_EQ(page.Picture4Width, 100) << "it does not move before it was at a limit";

@@ -1,4 +1,4 @@
-#include "Walk.h"
+#include "PageLook.h"
 
 #include "assembly/B3.h"
 #include "editing/EditRecord.h"
@@ -19,35 +19,6 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-struct Screen {
-    QSize size;
-    bool english;
-};
-
-void PrintTo(const Screen& screen, std::ostream* out) {
-    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
-}
-
-// Each page in each state: looked at for what a person could stumble over, and photographed where LUMORA_SHOTS asks for
-// it.
-class PageLook : public ::testing::TestWithParam<Screen> {
-protected:
-    void look(Walk& walk, const QString& name) {
-        walk.settle(60);
-        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
-        for (const QString& fault : walk.faults(GetParam().english))
-            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
-    }
-    void changed(Page& page, Walk& walk) {
-        Q_EMIT page.changed();
-        walk.settle(40);
-    }
-};
-
-} // namespace
 
 TEST_P(PageLook, FromTheStartToTheTerms) {
     Walk walk(GetParam().size);
@@ -273,8 +244,6 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     look(walk, u"49-album-closing"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, PageLook,
-                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
-                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens());
 
 } // namespace lumora

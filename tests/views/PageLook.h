@@ -1,0 +1,46 @@
+#pragma once
+
+#include "Walk.h"
+
+#include "session/Page.h"
+
+#include <QSize>
+
+#include <gtest/gtest.h>
+
+#include <ostream>
+
+namespace lumora {
+
+struct Screen {
+    QSize size;
+    bool english;
+};
+
+inline void PrintTo(const Screen& screen, std::ostream* out) {
+    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
+}
+
+// Each page in each state, in both languages and at the two ends of what screens are: looked at for what a person could
+// stumble over, and photographed where LUMORA_SHOTS asks for it.
+class PageLook : public ::testing::TestWithParam<Screen> {
+public:
+    static auto screens() {
+        return ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true}, Screen{{1920, 1080}, false},
+                                 Screen{{1920, 1080}, true});
+    }
+
+protected:
+    void look(Walk& walk, const QString& name) {
+        walk.settle(60);
+        walk.shot(QStringLiteral("%1-%2").arg(name, GetParam().english ? u"en" : u"he"));
+        for (const QString& fault : walk.faults(GetParam().english))
+            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
+    }
+    void changed(Page& page, Walk& walk) {
+        Q_EMIT page.changed();
+        walk.settle(40);
+    }
+};
+
+} // namespace lumora
