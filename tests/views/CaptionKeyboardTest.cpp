@@ -80,6 +80,21 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
     EXPECT_EQ(page.Text1.text.size(), 60);
 }
 
+TEST_P(CaptionKeyboard, StandsBelowThePictureThatItWritesOn) {
+    Walk walk(GetParam().size);
+    walk.toEditor(GetParam().english);
+    walk.press(u"tFrmNew"_s, u"Command8"_s);
+    walk.waitFor(u"mikledet"_s);
+    walk.type(u"mikledet"_s, u"Text1"_s, GetParam().english ? u"Our summer 2024"_s : u"הקיץ שלנו 2024"_s);
+    for (int i = 0; i < 4; ++i)
+        walk.press(u"mikledet"_s, u"Image1"_s);
+    walk.press(u"mikledet"_s, u"Image3"_s);
+    look(walk, u"33-caption"_s);
+    walk.press(u"mikledet"_s, u"CommandDone"_s);
+    walk.waitFor(u"tFrmNew"_s);
+    look(walk, u"34-captioned"_s);
+}
+
 TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     Walk walk({1024, 768});
     SessionState& state = walk.program().state();
