@@ -58,9 +58,12 @@ namespace {
 // that a long text with a quote that never closes takes no longer than another.
 class GrowingLine {
 public:
-    void append(const QString& part) {
+    // part: without its line end, which was CR LF or LF alone. A break inside an item stays as it was: the edit record
+    // of a caption with two lines has a fixed width.
+    void append(const QString& part, bool endsInCrLf) {
         if (m_open)
-            m_text += u'\n';
+            m_text += m_break;
+        m_break = endsInCrLf ? QStringLiteral("\r\n") : QStringLiteral("\n");
         const qsizetype from = m_text.size();
         m_text += part;
         if (m_valueAt < 0 && m_text.startsWith(u'"')) {
@@ -81,6 +84,7 @@ public:
 
 private:
     QString m_text;
+    QString m_break;
     qsizetype m_valueAt = -1; // where the item behind the key begins
     bool m_open = false;
 };
@@ -95,11 +99,12 @@ QStringList ListOutputLines(const QByteArray& bytes) {
     for (qsizetype i = 0; i < physical.size(); ++i) {
         const bool terminated = i + 1 < physical.size();
         QString part = physical[i];
-        if (part.endsWith(u'\r'))
+        const bool endsInCrLf = part.endsWith(u'\r');
+        if (endsInCrLf)
             part.chop(1);
         if (!terminated && part.isEmpty())
             break;
-        line.append(part);
+        line.append(part, endsInCrLf);
         if (!line.open())
             lines += line.take();
     }

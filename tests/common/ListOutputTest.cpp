@@ -53,8 +53,8 @@ TEST(ReadListOutput, LosesOneDamagedEntryAndNotTheLogBehindIt) {
 }
 
 TEST(ListOutputLines, JoinsABreakInsideAQuotedItem) {
-    EXPECT_EQ(ListOutputLines("\"Dana\r\nLevi\"\r\n\"x\"\r\n"),
-              QStringList({QStringLiteral("\"Dana\nLevi\""), QStringLiteral("\"x\"")}));
+    EXPECT_EQ(ListOutputLines("\"Dana\r\nLevi\"\r\n\"x\ny\"\r\n"),
+              QStringList({QStringLiteral("\"Dana\r\nLevi\""), QStringLiteral("\"x\ny\"")}));
     EXPECT_EQ(ListOutputLines("1\r\n\r\n2"), QStringList({QStringLiteral("1"), QString(), QStringLiteral("2")}));
     EXPECT_EQ(ListOutputLines(""), QStringList());
 }
