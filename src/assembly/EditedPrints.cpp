@@ -4,12 +4,12 @@
 #include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
 #include "imaging/BmpFile.h"
-#include "imaging/ColourMatrix.h"
 #include "platform/Files.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 
 #include <new>
+#include <utility>
 
 namespace lumora {
 namespace {
@@ -19,15 +19,14 @@ namespace fs = std::filesystem;
 EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::path& toneCopy) try {
     if (edit.ToneFlag != 1)
         return {renderEditedPrintToJpeg(print, edit)};
-    const Result<Bitmap> picture = loadPicture(print.file);
-    if (!picture)
-        return {picture.failure()};
+    Result<Bitmap> grey = loadGrey(print.file);
+    if (!grey)
+        return {grey.failure()};
+    print.grey = std::move(*grey);
     auto copy = std::make_unique<NewContent>(toneCopy, toText(toneCopy));
-    appendBmp(ColourMatrix::grey(greyWeight).applied(onWhite(*picture)), *copy, [] { return false; });
+    appendBmp(print.grey, *copy, [] { return false; });
     if (copy->failed())
         return {Failure{Failure::Kind::Other, toText(toneCopy)}, std::move(copy)};
-    print.file = copy->temporary();
-    print.source = EditedPrint::Source::AlreadyGrey;
     return {renderEditedPrintToJpeg(print, edit), std::move(copy)};
 } catch (const std::bad_alloc&) {
     return {Failure{Failure::Kind::TooLarge, QStringLiteral("%1: memory is short").arg(toText(print.file))}};

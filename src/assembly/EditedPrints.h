@@ -22,7 +22,7 @@ struct SessionState;
 struct EditedPrintResult {
     Result<QByteArray> jpeg;
     // With a tone: the whole picture in grey, of which the print was made. It becomes bw.bmp when its step commits it;
-    // until then it has a name of its own, so that no picture is ever printed from another one's copy.
+    // no print is made from that file, so that no picture is ever printed from another one's copy.
     std::unique_ptr<NewContent> toneCopy = {};
 };
 

@@ -49,8 +49,6 @@ public:
     // A failure is kept until commit and what is appended behind it is dropped.
     void append(const char* bytes, std::size_t count);
     bool failed() const { return m_error != 0; }
-    // Where what was appended can be read until it is committed.
-    const std::filesystem::path& temporary() const { return m_temporary; }
 
     // Syncs and renames. A passing file, which is of no use after a crash, need not wait for the disk.
     enum class Durability { Synced, Passing };

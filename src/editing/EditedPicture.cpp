@@ -110,6 +110,16 @@ Failure noRoom(const fs::path& file, PictureSize size) {
         QStringLiteral("%1: no memory for a picture of %2 x %3").arg(toText(file)).arg(size.width).arg(size.height)};
 }
 
+Result<Bitmap> loadGreyPart(const EditedPrint& print, PictureSize wanted, const QRect& part) {
+    Result<Bitmap> whole = print.grey.isNull() ? loadGrey(print.file) : Result<Bitmap>(print.grey);
+    if (!whole)
+        return whole;
+    Bitmap scaled = resampledPart(*whole, wanted, part);
+    if (scaled.isNull())
+        return noRoom(print.file, wanted);
+    return scaled;
+}
+
 } // namespace
 
 std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& edit, FrameUse use) {
@@ -222,6 +232,19 @@ Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>
     return paper;
 }
 
+Result<Bitmap> loadGrey(const fs::path& file) {
+    auto picture = loadPicture(file);
+    if (!picture)
+        return picture;
+    const PictureSize size{picture->width(), picture->height()};
+    if (picture->image().format() != QImage::Format_RGB32)
+        *picture = onWhite(*picture);
+    if (picture->isNull())
+        return noRoom(file, size);
+    ColourMatrix::grey(greyWeight).apply(*picture);
+    return picture;
+}
+
 Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
     Stopwatch watch(times);
     const auto size = readPictureSize(print.file);
@@ -243,7 +266,7 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
                   std::max(wanted.height, std::min(size->height, geometry.size.height))};
         part |= QRect(0, 0, wanted.width, wanted.height);
     }
-    auto loaded = loadPicturePart(print.file, wanted, part);
+    auto loaded = edit.ToneFlag == 1 ? loadGreyPart(print, wanted, part) : loadPicturePart(print.file, wanted, part);
     if (!loaded)
         return loaded.failure();
     watch.add(&PictureTimes::decode);
@@ -251,8 +274,6 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
     Bitmap& picture = *loaded;
     if (picture.image().format() != QImage::Format_RGB32)
         picture = onWhite(picture);
-    if (edit.ToneFlag == 1 && print.source == EditedPrint::Source::AsItIs)
-        ColourMatrix::grey(greyWeight).apply(picture);
     const Bitmap whole = within(picture, QRect(-part.topLeft(), QSize(wanted.width, wanted.height)));
     Bitmap paper = stretched ? resampled(whole, geometry.size)
                              : Bitmap(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));

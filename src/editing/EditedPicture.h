@@ -83,10 +83,12 @@ struct EditedPrint {
     std::filesystem::path file; // the customer's picture or its corrected copy
     PaperDigits paper;
     std::filesystem::path framesFolder;
-    // A tone makes the picture grey first. AlreadyGrey: the file is a grey copy, whatever the record says.
-    enum class Source { AsItIs, AlreadyGrey } source = Source::AsItIs;
-    std::optional<QColor> background; // without it the whole picture, stretched
+    Bitmap grey = {};                      // what loadGrey() made of the file, where that was done before
+    std::optional<QColor> background = {}; // without it the whole picture, stretched
 };
+
+// The whole picture as a tone prints it: grey at full size, ahead of any scaling.
+Result<Bitmap> loadGrey(const std::filesystem::path& file);
 
 // The pixels of the print: 100 a centimetre, lying or upright as the file is.
 Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times = nullptr);

@@ -1,12 +1,7 @@
-#include "PlainOrder.h"
+#include "EditedOrder.h"
 
-#include "assembly/B3.h"
 #include "assembly/OrderCheck.h"
-#include "common/DrivePathText.h"
-#include "common/FixedText.h"
-#include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
-#include "editing/gdisave.h"
 #include "support/SmallDisk.h"
 
 #include <QCoreApplication>
@@ -16,82 +11,6 @@
 
 namespace lumora {
 namespace {
-
-using Changes = QList<std::pair<EditRecord::Column, QString>>;
-
-// A picture that was opened in the editor and left as it is, with some fields changed.
-QString record(const Changes& changes = {}) {
-    QString text = EditRecord::newPicture();
-    const auto set = [&](EditRecord::Column column, const QString& value) {
-        text.replace(column.position - 1, column.width, LeftField(value, column.width));
-    };
-    set(EditRecord::PanX, QStringLiteral("225"));
-    set(EditRecord::PanY, QStringLiteral("150"));
-    for (const auto& [column, value] : changes)
-        set(column, value);
-    return text;
-}
-
-const Changes toned = {{EditRecord::ToneFlag, QStringLiteral("1")}};
-const Changes corrected = {{EditRecord::RedMarker, QStringLiteral("RED")}};
-const Changes both = toned + corrected;
-
-class PreparingAnEditedOrder : public PreparingAPlainOrder {
-protected:
-    PreparingAnEditedOrder() {
-        state.Optint = 2;
-        chain.registerPage(PageId::B3, [this] { return std::make_unique<B3>(state, machine.platform, chain); });
-        chain.registerPage(PageId::gdisave,
-                           [this] { return std::make_unique<gdisave>(state, machine.platform, chain); });
-        for (const char* path : {"C:\\2000lumora", "C:\\2000lumora\\zmany", "C:\\2000lumora\\zmany\\tempred"})
-            makeFolder(QString::fromLatin1(path));
-    }
-
-    static QString edited(const QString& path, const QString& edits = record(),
-                          const QString& copies = QStringLiteral("1 ")) {
-        return copies + QStringLiteral("1015GNB") + edits + path;
-    }
-    B3& open(const QStringList& items) {
-        state.handOver.lines = items;
-        chain.show(PageId::B3);
-        return *dynamic_cast<B3*>(chain.find(PageId::B3));
-    }
-    // The paths that failed.
-    QStringList prepare(const QStringList& items) {
-        B3& page = open(items);
-        const TextList& failed = page.List4fail;
-        page.Timer2_Tick();
-        return failed.items();
-    }
-    // What the red-eye page would have left: bitmap data under the picture's own name.
-    void giveCorrected(const QString& path, QColor colour) {
-        EXPECT_TRUE(Bitmap(40, 30, colour).image().save(hostText(correctedPath(path)), "BMP"));
-    }
-    static QString correctedPath(const QString& path) {
-        return QStringLiteral("C:\\2000lumora\\zmany\\tempred\\") + MangleFileName(path);
-    }
-    QString hostText(const QString& path) const { return toText(*machine.drives.toHost(path)); }
-    bool exists(const QString& path) const { return machine.files.fileExists(path); }
-
-    // The picture inside the print file of that place in the list.
-    QImage print(int index) const {
-        for (const QString& name : printFiles(state.MisparHazmana)) {
-            if (name.mid(9, 4).toInt() == index)
-                return QImage::fromData(unpacked(name, state.MisparHazmana)->picture, "JPEG");
-        }
-        return {};
-    }
-    static void expectColour(const QImage& picture, QPoint at, QColor wanted) {
-        ASSERT_FALSE(picture.isNull());
-        const QColor found = picture.pixelColor(at);
-        EXPECT_NEAR(found.red(), wanted.red(), 4);
-        EXPECT_NEAR(found.green(), wanted.green(), 4);
-        EXPECT_NEAR(found.blue(), wanted.blue(), 4);
-    }
-
-    const QString bw = QStringLiteral("C:\\2000lumora\\bw.bmp");
-    const QString jobFolder = QStringLiteral("C:\\2000lumora\\zmany\\job_folder");
-};
 
 TEST_F(PreparingAnEditedOrder, writesTheLogThatTheLabExpectsToTheByte) {
     const QString newPicture = EditRecord::newPicture();

@@ -39,7 +39,8 @@ Modes:
 
 Options:
   --paper 10/15   the paper, short side and long side in centimetres
-  --record TEXT   the edit record for preview and print; blanks follow (default: a picture that was not edited)
+  --record TEXT   the edit record for preview and print; blanks follow (default: a picture that was not edited);
+                  with red eyes corrected, FILE is the corrected copy
   --frames FOLDER the folder that holds the categories of frames (default: no frames)
   --background RRGGBB  what an uncovered part of the paper shows (default: the whole picture, stretched)
   --size 115      pixels of the cell for the mode small (default 115)
