@@ -87,6 +87,19 @@ bool isPlainName(const QString& name) {
            !name.contains(QStringLiteral("..")) && !name.contains(QChar(0)) && name != QStringLiteral(".");
 }
 
+// The labs that make frames see no difference between "k011.bmp" and "K011.BMP".
+fs::path fileNamed(const fs::path& folder, const QString& leaf) {
+    const fs::path exact = folder / toHostPath(leaf);
+    std::error_code error;
+    if (fs::exists(exact, error))
+        return exact;
+    for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
+        if (toText(at->path().filename()).compare(leaf, Qt::CaseInsensitive) == 0)
+            return at->path();
+    }
+    return exact;
+}
+
 // The work picture: shrunk by the averaging cubic, enlarged by a straight line between pixels, as the lab's own editor
 // does when it loads a picture smaller than that.
 Result<Bitmap> loadWork(const fs::path& file, PictureSize fileSize, PictureSize wanted) {
@@ -129,7 +142,7 @@ std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& 
         !isPlainName(name) || !isPlainName(folder))
         return std::nullopt;
     const auto load = [&](const QString& leaf) -> std::optional<Bitmap> {
-        auto frame = loadPicture(framesFolder / toHostPath(folder) / toHostPath(leaf + QStringLiteral(".bmp")));
+        auto frame = loadPicture(fileNamed(framesFolder / toHostPath(folder), leaf + QStringLiteral(".bmp")));
         return frame ? std::optional(*frame) : std::nullopt;
     };
     if (use == FrameUse::Print) {

@@ -26,10 +26,10 @@ QStringList FrameLists::names(const QString& category, ListFile kind) const {
 }
 
 QString FrameLists::listFile(const QString& category, const QString& name) const {
+    const QString folder = JoinDrivePath(m_folder, category);
     for (const QString& ending : {QStringLiteral(".png"), QStringLiteral(".bmp")}) {
-        const QString path = JoinDrivePath(JoinDrivePath(m_folder, category), name + ending);
-        if (m_files.fileExists(path))
-            return path;
+        if (const QStringList found = m_files.names(folder, name + ending); !found.isEmpty())
+            return JoinDrivePath(folder, found.first());
     }
     return {};
 }

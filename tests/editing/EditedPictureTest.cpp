@@ -163,6 +163,8 @@ TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
     EXPECT_EQ(frame("blue", "ab", FrameUse::Preview), QColor(Qt::green));
     EXPECT_EQ(frame("blue", "ab", FrameUse::Print), QColor(Qt::green));
     EXPECT_EQ(frame("blue", "cd", FrameUse::Print), QColor(Qt::yellow)) << "what was seen is printed";
+    std::filesystem::rename(path("frames/blue/kcd.bmp"), path("frames/blue/KCD.Bmp"));
+    EXPECT_EQ(frame("blue", "cd", FrameUse::Preview), QColor(Qt::yellow)) << "letter case does not count";
     for (const char* folder : {"..", "blue/../..", "blue\\..\\..", "/tmp", "C:"})
         EXPECT_FALSE(frame(folder, "out", FrameUse::Preview).isValid()) << folder;
     for (const char* name : {"000", "999", "", "zz", "../../kout"})
