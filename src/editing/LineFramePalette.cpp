@@ -14,8 +14,8 @@ QRect LineFramePalette::marker() const {
     return {m_index / rows * cell, m_index % rows * cell, cell, cell};
 }
 
-QChar LineFramePalette::letter() const {
-    return QLatin1StringView("WRPSKGYH8BTU")[m_index];
+QChar LineFramePalette::letterOf(int cellIndex) {
+    return QLatin1StringView("WRPSKGYH8BTU")[cellIndex];
 }
 
 } // namespace lumora

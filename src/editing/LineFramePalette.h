@@ -21,8 +21,9 @@ public:
     int index() const { return m_index; }
     QRect marker() const;
 
-    // The letter of the cell under the marker, as the record carries it.
-    QChar letter() const;
+    // The letter of a cell, as the record carries it; of the one under the marker.
+    static QChar letterOf(int cellIndex);
+    QChar letter() const { return letterOf(m_index); }
 
 private:
     int m_index = 0;

@@ -129,10 +129,10 @@ Bitmap tFrmNew::framePicture(int index) const {
 
 void tFrmNew::stepLineStyle(int step) {
     const int next = Combo5List.currentIndex() + step;
-    if (!m_open || next < 0)
+    if (!m_open || Combo5List.isEmpty() || next < -1)
         return;
-    if (next <= Combo5List.lastIndex())
-        Combo5List.setCurrentIndex(next);
+    // At either end the style stays and is taken once more.
+    Combo5List.setCurrentIndex(std::clamp(next, 0, Combo5List.lastIndex()));
     Combo5.text = Combo5List.currentItem();
     FrameStyleDigits = Combo5.text.rightJustified(2, u'0');
     edit().LineFrameCode = lineFrameLetter() + FrameStyleDigits;

@@ -1,5 +1,6 @@
 // The editor's panels: tones, turns, the hints in words, and the operator's tools.
 #include "editing/EditedPicture.h"
+#include "editing/LineFrame.h"
 #include "views/Cards.h"
 #include "views/EditorPaper.h"
 #include "views/Overlay.h"
@@ -70,14 +71,17 @@ protected:
     void paintEvent(QPaintEvent*) override {
         QPainter painter(this);
         painter.setPen(Theme::Colour::Line);
-        painter.setBrush(Theme::Colour::Surface);
-        for (int i = 0; i < LineFramePalette::columns * LineFramePalette::rows; ++i)
+        for (int i = 0; i < LineFramePalette::columns * LineFramePalette::rows; ++i) {
+            painter.setBrush(*lineFrameColour(LineFramePalette::letterOf(i)));
             painter.drawRect(i / LineFramePalette::rows * LineFramePalette::cell,
                              i % LineFramePalette::rows * LineFramePalette::cell, LineFramePalette::cell - 1,
                              LineFramePalette::cell - 1);
+        }
+        const QColor colour = *lineFrameColour(m_page.palette.letter());
         painter.setPen(QPen(Theme::Colour::Primary, 2));
-        painter.setBrush(Theme::Colour::PrimarySoft);
+        painter.setBrush(colour);
         painter.drawRect(m_page.palette.marker().adjusted(1, 1, -1, -1));
+        painter.setPen(colour.lightness() < 128 ? Qt::white : Qt::black);
         painter.drawText(m_page.palette.marker(), Qt::AlignCenter, m_page.palette.letter());
     }
 

@@ -467,6 +467,8 @@ TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
     makeFrame(QStringLiteral("much too long"), QStringLiteral("001"), Qt::green);
     makeFrame(QStringLiteral("aa"), QStringLiteral("long"), Qt::green);
     makeFrame(QStringLiteral("aa"), QStringLiteral("K9"), Qt::green);
+    const HostPath listFile = host(JoinDrivePath(WorkspacePaths::misgarot(state), QStringLiteral("aa\\002.png")));
+    std::filesystem::rename(listFile, HostPath(listFile).replace_extension("PNG")); // letter case does not count
     tFrmNew& editor = open(lying);
     EXPECT_EQ(editor.Combo4List.items(), QStringList({QStringLiteral("aa"), QStringLiteral("bb")}));
     EXPECT_EQ(editor.Combo2List.items(), QStringList({QStringLiteral("001"), QStringLiteral("002")}));
@@ -513,6 +515,11 @@ TEST_F(TheEditor, recordsLineFramesAndPaintsThemNowhere) {
     EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("Y29"));
     editor.Command18_Click();
     EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("Y28"));
+    for (int i = 0; i < 30; ++i)
+        editor.Command18_Click();
+    editor.Image28_Click();
+    editor.Command18_Click(); // the first stays and is taken again
+    EXPECT_EQ(stored.last().mid(35, 3), QStringLiteral("Y01"));
     EXPECT_EQ(editor.PicPic.image(), before);
 }
 
