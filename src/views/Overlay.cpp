@@ -155,4 +155,12 @@ Overlay* frontOverlay(const QWidget& root) {
     return front;
 }
 
+void giveFocus(QWidget& widget) {
+    Overlay* front = frontOverlay(*widget.window());
+    if (front && !front->isAncestorOf(&widget))
+        front->setFocusBehind(&widget);
+    else
+        widget.setFocus(Qt::OtherFocusReason);
+}
+
 } // namespace lumora

@@ -30,6 +30,8 @@ public:
     void setFilling();
     // What has the keyboard when the panel opens.
     void setFirstFocus(QWidget* widget) { m_firstFocus = widget; }
+    // What has it once the panel has closed, in place of what had it before.
+    void setFocusBehind(QWidget* widget) { m_before = widget; }
 
 Q_SIGNALS:
     void escaped();
@@ -60,5 +62,9 @@ private:
 
 // The open panel that lies in front within root, null when there is none.
 Overlay* frontOverlay(const QWidget& root);
+
+// Gives the keyboard to the widget: at once, or, while a panel lies before it, when that panel closes. A page asks for
+// a box right behind the message that tells why, and the message must keep the keyboard until it is read.
+void giveFocus(QWidget& widget);
 
 } // namespace lumora

@@ -511,7 +511,7 @@ void kyoskNewView::takeFocus() {
         return;
     m_focusRequest = m_page.focusRequest;
     if (auto* widget = findChild<QWidget*>(m_page.focusBox))
-        widget->setFocus(Qt::OtherFocusReason);
+        giveFocus(*widget);
 }
 
 void kyoskNewView::render() {

@@ -373,10 +373,10 @@ void nnnView::render() {
     if (m_focusRequest != m_page.focusRequest) {
         m_focusRequest = m_page.focusRequest;
         if (auto* box = findChild<QWidget*>(m_page.focusBox))
-            box->setFocus(Qt::OtherFocusReason);
+            giveFocus(*box);
     } else if (moved && !m_clean->isOpen()) {
         if (QWidget* first = firstFocus())
-            first->setFocus(Qt::OtherFocusReason);
+            giveFocus(*first);
     }
 }
 

@@ -3,6 +3,7 @@
 #include "views/AlbumCard.h"
 #include "views/ChoiceCards.h"
 #include "views/EditableCombo.h"
+#include "views/Overlay.h"
 
 #include <QCheckBox>
 #include <QGridLayout>
@@ -328,7 +329,7 @@ void nnnView::Album::render() {
     m_parents->move(side * m_theme.px(m_album.parentsShift), m_parents->y());
     if (moved && m_view.m_page.step == nnn::Step::Album) {
         if (QWidget* first = firstFocus())
-            first->setFocus(Qt::OtherFocusReason);
+            giveFocus(*first);
     }
 }
 

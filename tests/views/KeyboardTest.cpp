@@ -110,6 +110,65 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     EXPECT_EQ(walk.program().state().shemot.Bord, u"WB"_s);
 }
 
+TEST(Keyboard, PutsAnAlbumTogetherWithoutAMouse) {
+    Walk walk({1024, 768});
+    walk.program().window().activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
+    walk.press(u"hatchala"_s, u"Image1"_s);
+    walk.waitFor(u"nnn"_s);
+    tabTo(walk, u"Image1(6)"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_EQ(focusName(), u"Text1(0)"_s) << "the first box has the keyboard";
+    text(u"Studio Or"_s);
+    key(walk, Qt::Key_Return); // the main action
+    ASSERT_EQ(focusName(), u"SoogAlb(0)"_s);
+    key(walk, Qt::Key_Tab);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Check4"_s);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Combo4Horim"_s);
+    key(walk, Qt::Key_Down);
+    tabTo(walk, u"Command16"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_EQ(focusName(), u"Combo4Godel(0)"_s);
+    tabTo(walk, u"Combo4Godel(2)"_s);
+    key(walk, Qt::Key_Space);
+    EXPECT_EQ(focusName(), u"Combo4Godel(2)"_s) << "a card that is taken keeps the keyboard";
+    for (const auto& [next, card] : {std::pair{u"Command18"_s, u"Combo4Cricha(1)"_s},
+                                     {u"Command19"_s, u"Combo4Niyar(0)"_s},
+                                     {u"Command20"_s, u"Combo4Tosefet(3)"_s}}) {
+        tabTo(walk, next);
+        key(walk, Qt::Key_Return);
+        tabTo(walk, card);
+        key(walk, Qt::Key_Return);
+    }
+    tabTo(walk, u"Check3(5)"_s);
+    key(walk, Qt::Key_Space);
+    key(walk, Qt::Key_Escape);
+    const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album;
+    EXPECT_EQ(album.panel, AlbumPanels::Panel::Paper) << "Esc goes one panel back";
+    tabTo(walk, u"Command20"_s);
+    key(walk, Qt::Key_Return);
+    tabTo(walk, u"Command21"_s);
+    key(walk, Qt::Key_Return);
+    ASSERT_EQ(focusName(), u"Check6"_s);
+    key(walk, Qt::Key_Space);
+    tabTo(walk, u"Command22"_s);
+    key(walk, Qt::Key_Return);
+    // The telephone is missing: its box is where the keyboard is once the message is read.
+    EXPECT_EQ(walk.program().dialogs().shownTexts, QStringList{u"לא כתבתה מספר טלפון"_s});
+    key(walk, Qt::Key_Return);
+    EXPECT_EQ(focusName(), u"Text1(1)"_s);
+    const AlbumDetails& details = walk.program().state().album;
+    EXPECT_EQ(details.SoogLBM, u"אינדיגו  ספירלה");
+    EXPECT_EQ(details.SoogHorim, u"20/40");
+    EXPECT_EQ(details.GodelLBM, u"30/60");
+    EXPECT_EQ(details.SoogKricha, u"קרם");
+    EXPECT_EQ(details.SoogNiar, u"מבריק");
+    EXPECT_EQ(details.Tosafot1[0], u"פרספקט");
+    EXPECT_EQ(details.Tosafot2[5], u"פתיחה אנגלית=1");
+}
+
 TEST(Language, TurnsOverOnEachPageAndBack) {
     Walk walk({1024, 768});
     const auto flip = [&](PageId id) {
