@@ -66,8 +66,8 @@ void tFrmNew::load() {
         edit().FrameFolder = Combo4List.item(0);
         Combo4.text = Combo4List.item(0);
         Combo4List.setCurrentIndex(0);
-        fillFrames(FrameLists::ListFile::Png);
     }
+    fillFrames(FrameLists::ListFile::Png);
     PackEditState();
     showNumbers();
 }

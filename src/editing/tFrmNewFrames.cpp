@@ -17,7 +17,8 @@ constexpr int framePictureSize = 160;
 
 void tFrmNew::fillFrames(FrameLists::ListFile kind) {
     Combo2List.clear();
-    Combo2List.append(m_frames.names(Combo4.text, kind));
+    if (!Combo4.text.isEmpty())
+        Combo2List.append(m_frames.names(Combo4.text, kind));
     Label5.text = QString::number(Combo2List.count());
     Label6.text.clear();
     const QString border = m_state.shemot.Bord.left(2);

@@ -499,6 +499,16 @@ TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
     EXPECT_GT(corner().green(), 240);
 }
 
+TEST_F(TheEditor, leavesTheBordersFrameAloneWhereTheLabHasNoFrames) {
+    state.shemot.Bord = QStringLiteral("WB");
+    tFrmNew& editor = open(lying);
+    EXPECT_EQ(editor.Label5.text, QStringLiteral("0"));
+    editor.Image20_Click();
+    editor.Image21_Click();
+    editor.Image22_Click();
+    EXPECT_EQ(field(EditRecord::FrameName), QStringLiteral("001"));
+}
+
 TEST_F(TheEditor, recordsLineFramesAndPaintsThemNowhere) {
     tFrmNew& editor = open(lying);
     const QImage before = editor.PicPic.image();
