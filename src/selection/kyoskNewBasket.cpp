@@ -142,8 +142,10 @@ void kyoskNew::setCopies(int cell, int copies) {
     if (copies == 0) {
         List1.removeAt(index);
         Picture4[at].visible = false;
-        if (Command13[at].colour == KeyColour::Orange)
+        if (Command13[at].colour == KeyColour::Orange) {
+            Command13[at].colour = KeyColour::System;
             editorView.visible = false;
+        }
         if (!plain() && index >= 0)
             repaintStored(path); // as the file is: chosen again it begins without its edits
     } else {

@@ -345,6 +345,7 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
     EXPECT_GT(redAt(0), 200);
     page.Command13_Click(0);
     EXPECT_FALSE(page.editorView.visible);
+    EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::System);
 }
 
 TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
