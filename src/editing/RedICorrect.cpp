@@ -5,6 +5,7 @@
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "editing/RedOverview.h"
+#include "platform/BlockingCall.h"
 #include "platform/Dialogs.h"
 #include "platform/Files.h"
 #include "platform/Platform.h"
@@ -217,7 +218,18 @@ void RedI::forgetLists() {
 bool RedI::keepUndoCopy(const QRect& part) {
     const QRect inside = part & Picture1.image().rect();
     const Result<void> folders = Workspace(m_state, m_platform.files).MakeWorkspace();
-    const Result<void> kept = folders ? m_undo.keep(Picture1, inside) : folders;
+    const auto keep = [&] { return folders ? m_undo.keep(Picture1, inside) : folders; };
+    // Who is quicker than the disk waits for it, and is told so.
+    Result<void> kept;
+    if (m_undo.isReady()) {
+        kept = keep();
+    } else {
+        waitFor(m_state.wording(u"רגע אחד, נשמר עותק לביטול…"_s, u"One moment, keeping a copy for undo…"_s));
+        kept = RunBlocking(keep);
+        busy = false;
+        Label4Busy.visible = false;
+        showState();
+    }
     if (!kept) {
         m_platform.dialogs.message(m_state
                                        .wording(u"לא ניתן לשמור עותק לביטול, ולכן התיקון לא נעשה.\n%1"_s,

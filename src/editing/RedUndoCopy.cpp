@@ -15,10 +15,12 @@ void RedUndoCopy::begin(const Bitmap& picture, const std::filesystem::path& file
     end();
     m_file = file;
     m_waiting.emplace(m_file, QString::fromLocal8Bit(m_file.c_str()));
+    m_written = false;
     // The thread has the picture to itself: nobody changes it before finishWriting() has joined the thread.
     m_writer = std::jthread([this, copy = Bitmap(picture)](const std::stop_token& stop) mutable {
         appendBmp(copy, *m_waiting, [&stop] { return stop.stop_requested(); });
         copy = Bitmap();
+        m_written = true;
     });
 }
 

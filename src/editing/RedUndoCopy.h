@@ -8,6 +8,7 @@
 #include <QRect>
 #include <QRegion>
 
+#include <atomic>
 #include <filesystem>
 #include <optional>
 #include <thread>
@@ -28,6 +29,9 @@ public:
 
     // Starts writing the copy beside file; what an earlier visit left there is not touched yet.
     void begin(const Bitmap& picture, const std::filesystem::path& file);
+
+    // False while keep() would have to wait for the writing of a whole picture.
+    bool isReady() const { return m_rows || (m_written && m_waiting && !m_waiting->failed()); }
 
     // To be called before the part of the picture changes: the file then holds the picture as it is now. Waits for the
     // background work if it is still under way.
@@ -51,6 +55,7 @@ private:
 
     std::filesystem::path m_file;
     std::optional<NewContent> m_waiting; // the copy until the first change
+    std::atomic<bool> m_written = false; // the thread is done with m_waiting
     std::jthread m_writer;
     std::optional<BmpRows> m_rows;
     QRegion m_differs; // where picture and file differ

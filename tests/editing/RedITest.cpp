@@ -293,8 +293,11 @@ TEST_F(RedEyePage, DoesNotCorrectWhatItCouldNotTakeBack) {
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_EQ(page.Picture1.image(), original);
     EXPECT_FALSE(page.RedChanged);
+    EXPECT_TRUE(page.Image2.enabled);
     std::filesystem::remove(*machine.drives.toHost(u"C:\\2000lumora\\zmany\\tempred"_s));
-    page.Image2_Click();
+    page.Image2_Click(); // the whole copy is written now, while the page waits
+    EXPECT_FALSE(page.Label4Busy.visible);
+    EXPECT_TRUE(page.Image2.enabled);
     EXPECT_TRUE(page.RedChanged);
     EXPECT_EQ(pictureIn(undoCopy), original);
 }
