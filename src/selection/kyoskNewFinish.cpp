@@ -233,6 +233,7 @@ bool kyoskNew::handTo(PageId next) {
     if (m_handedOver || !m_chain.isRegistered(next))
         return false;
     m_handedOver = true;
+    leaveEditor(); // a picture that is still open there
     ++m_drawing;
     Timer1.stop();
     Timer2.stop();

@@ -410,11 +410,13 @@ TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
     editor().Image15_Click();
-    editor().CommandDone_Click();
+    editor().Image2_MouseDown(0);
+    editor().Timer2_Tick(); // still held, and the editor not left
     page.Image7_Click();
     page.Command7_Click();
     ASSERT_EQ(chain.front()->id(), PageId::B3);
-    EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 3), QStringLiteral("270"));
+    EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 6), QStringLiteral("270102"));
+    EXPECT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
     EXPECT_EQ(chain.find(PageId::tFrmNew), nullptr);
     EXPECT_EQ(chain.find(PageId::BigPics), nullptr);
     // A further order begins without the record of this one.
