@@ -38,7 +38,7 @@ void kyoskNew::load() {
     Image13.visible = m_state.Optint == 10;
     Image7.visible = !Image13.visible;
     const bool coupon = m_state.coupon.HaKoopon == 1;
-    for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3})
+    for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3, &Label4kpn3Prompt})
         couponOnly->visible = coupon;
     const bool asksAddress = !m_state.TachanaMekomit;
     for (Caption* address : {&Label33, &Label17, &Text1, &Combo1, &Command8})

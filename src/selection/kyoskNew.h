@@ -186,6 +186,7 @@ public:
     int Combo1Index = -1;
     Caption LblKoopon;
     Caption Label4kpn3; // the quantity of the coupon
+    Caption Label4kpn3Prompt;
     Caption Command7, Command8, Command10;
     // The box that takes the keyboard next; a view moves the focus when the number has changed.
     QString focusBox;
@@ -252,6 +253,7 @@ private:
     void HandToSecondPageNoMail();
     bool handTo(PageId next);
     QString noteOfOrder() const;
+    void openBranches();
     void ShowBranchCard();
 
     void setBrowserTexts();

@@ -11,10 +11,17 @@
 namespace lumora {
 
 void kyoskNew::Image7_Click() {
+    openBranches();
+    Command3_Click();
+}
+
+void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
         Command4Snif[branch].text = m_state.profile.Branches[branch].caption;
-    Command3_Click();
+    // The shops have the names that the lab gives them; home delivery is a word of ours.
+    if (m_state.english())
+        Command4Snif.back().text = QStringLiteral("Home delivery");
 }
 
 void kyoskNew::Image13_Click() {
@@ -131,16 +138,15 @@ void kyoskNew::ShowBranchCard() {
     QStringList rows;
     if (branchInHand >= 0 && branchInHand < static_cast<int>(m_state.profile.Branches.size())) {
         const Branch& branch = m_state.profile.Branches[static_cast<std::size_t>(branchInHand)];
-        rows = {branch.name, branch.address[0], branch.address[1], branch.phone};
+        rows = {branch.name.isEmpty() ? Command4Snif[static_cast<std::size_t>(branchInHand)].text : branch.name,
+                branch.address[0], branch.address[1], branch.phone};
         rows.removeAll(QString());
     }
     Label41.text = rows.join(u'\n');
 }
 
 void kyoskNew::Image33_Click() {
-    Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
-    for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
-        Command4Snif[branch].text = m_state.profile.Branches[branch].caption;
+    openBranches();
     Q_EMIT changed();
 }
 

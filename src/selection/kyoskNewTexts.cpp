@@ -124,6 +124,7 @@ void kyoskNew::setClosingTexts() {
         Combo1.text = mailDomainPrompt(m_state.english());
     set(LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
         u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box ");
+    set(Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon");
     Label4kpn3.text = QString::number(m_state.coupon.MisparKoopon);
     if (m_state.TachanaMekomit)
         set(Command7, u"המשך", u"Continue");

@@ -300,7 +300,11 @@ void kyoskNewView::makeClosingPanel() {
     fact(u"Label20Prompt"_s, m_page.Label20Prompt, u"Label20"_s, m_page.Label20);
     fact(u"Label19Prompt"_s, m_page.Label19Prompt, u"Label19"_s, m_page.Label19);
     column->addWidget(facts);
-    column->addWidget(label(u"Label4kpn3"_s, m_page.Label4kpn3, "muted"));
+    auto* coupon = new QHBoxLayout;
+    coupon->setSpacing(theme().px(8));
+    coupon->addWidget(label(u"Label4kpn3Prompt"_s, m_page.Label4kpn3Prompt, "muted"));
+    coupon->addWidget(label(u"Label4kpn3"_s, m_page.Label4kpn3, "strong"), 1);
+    column->addLayout(coupon);
 
     auto* mailLine = new QHBoxLayout;
     mailLine->addWidget(label(u"Label17"_s, m_page.Label17, "strong"));
@@ -393,7 +397,7 @@ void kyoskNewView::makeBranchPanel() {
 }
 
 bool kyoskNewView::eventFilter(QObject* watched, QEvent* event) {
-    if (event->type() == QEvent::Enter) {
+    if (event->type() == QEvent::Enter || event->type() == QEvent::MouseButtonPress) { // a finger only presses
         for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
             if (watched == m_branchButtons[i] && !isDetached())
                 m_page.Command4Snif_MouseMove(static_cast<int>(i));

@@ -508,6 +508,7 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
         machine.dialogs.messages,
         QStringList({QStringLiteral("עליך לבחור תמונות לא פחות מהכמות שרכשת בקופון\nלא תתקבלנה הזמנות שאינן במלואן"),
                      QStringLiteral("חרגת מכמות התמונות שרכשת בקופון\nעליך לבטל בחירה של חלק מהתמונות")}));
+    EXPECT_EQ(page.List1.SumCopies(), 3) << "a refusal leaves the basket whole";
     page.Command13_Click(0);
     page.Image7_Click();
     EXPECT_TRUE(page.Frame4.visible);
@@ -516,6 +517,8 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     EXPECT_EQ(page.Label41.text, QStringLiteral("סניף חיפה\nהנביאים 1\n04-1"));
     page.Command4Snif_MouseMove(11);
     EXPECT_EQ(page.Label41.text, QString());
+    page.Command4Snif_MouseMove(10);
+    EXPECT_EQ(page.Label41.text, page.Command4Snif[10].text) << "home delivery has no address";
     page.Command4Snif_Click(3);
     EXPECT_FALSE(page.Pic4snifim.visible);
     page.Image7_Click();

@@ -133,8 +133,11 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
 }
 
 TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
-    QString settings = u"[Switches]\nCoupon = yes\nDeepCompression = ask\n"_s;
-    Walk walk(GetParam().size, settings);
+    Walk walk(
+        GetParam().size,
+        u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
+        "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
+        "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n"_s);
     if (GetParam().english)
         walk.press(u"hatchala"_s, u"Check1"_s);
     walk.press(u"hatchala"_s, u"Image1"_s);
@@ -146,6 +149,8 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
         ControlFinder(walk.program().window()).choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex())).ok());
     walk.press(u"nnn"_s, u"Option3(0)"_s);
     walk.toTerms();
+    look(walk, u"23-fit"_s);
+    walk.press(u"nnn"_s, u"Option5"_s);
     walk.toPictures();
     walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() + u"\\IMG_0001.jpg"_s; };
     walk.press(u"kyoskNew"_s, u"Image5"_s);
@@ -156,6 +161,10 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     walk.program().state().coupon.HaKoopon = 1;
     walk.press(u"kyoskNew"_s, u"Image7"_s);
     look(walk, u"24-panel-in-front"_s);
+    walk.press(u"kyoskNew"_s, u"Command21"_s);
+    look(walk, u"24-branches"_s);
+    walk.press(u"kyoskNew"_s, u"Command4Snif(10)"_s);
+    look(walk, u"24-closing-coupon"_s);
 }
 
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {

@@ -12,6 +12,7 @@
 #include "views/ScreenDialogs.h"
 
 #include <QAbstractButton>
+#include <QAbstractItemModel>
 #include <QAbstractScrollArea>
 #include <QAccessible>
 #include <QComboBox>
@@ -74,6 +75,26 @@ void unnamed(QAccessibleInterface* node, QStringList& faults) {
         unnamed(node->child(i), faults);
 }
 
+// Made once for all walks of this process.
+HostPath photographs() {
+    static const QTemporaryDir folder;
+    static const bool made = writeSamplePhotographs(toHostPath(folder.path()), 14, 1.2).ok();
+    EXPECT_TRUE(made);
+    return toHostPath(folder.path());
+}
+
+// What a button says: in letters, or by its sign and a spoken name.
+bool hasText(const QAbstractButton& button) {
+    return !button.text().trimmed().isEmpty() || !button.accessibleName().trimmed().isEmpty();
+}
+
+QString rowsOf(const QAbstractItemModel& model) {
+    QString all;
+    for (int row = 0; row < model.rowCount(); ++row)
+        all += model.index(row, 0).data().toString() + u' ';
+    return all;
+}
+
 bool insideScroller(const QWidget& widget) {
     for (const QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
         if (qobject_cast<const QAbstractScrollArea*>(parent))
@@ -124,7 +145,7 @@ Walk::Walk(QSize size, const QString& labSettings) {
     m_program = std::make_unique<Program>(std::move(options));
     const Result<void> started = m_program->start();
     EXPECT_TRUE(started.ok()) << (started ? "" : qPrintable(started.failure().message));
-    EXPECT_TRUE(writeSamplePhotographs(root / "Pictures", 14, 1.2).ok());
+    std::filesystem::copy(photographs(), root / "Pictures");
     settle(60);
 }
 
@@ -264,6 +285,10 @@ QStringList Walk::faults(bool english) {
     unnamed(QAccessible::queryAccessibleInterface(&window), result);
     const Overlay* panel = frontOverlay(window);
     const QWidget* root = panel ? static_cast<const QWidget*>(panel) : window.frontView();
+    if (root->layoutDirection() != (english ? Qt::LeftToRight : Qt::RightToLeft))
+        result += u"the page runs the other way"_s;
+    if (english && hasHebrew(window.windowTitle()))
+        result += u"a Hebrew title"_s;
     for (const QWidget* widget : root->findChildren<QWidget*>()) {
         if (!widget->isVisible() || widget->size().isEmpty())
             continue;
@@ -290,14 +315,20 @@ QStringList Walk::faults(bool english) {
             if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
                 result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
         }
+        if (!foreign && button && !hasText(*button))
+            result += u"no caption: "_s + nameOf(*widget);
         if (english && !widget->property("letterOfAnyLanguage").toBool()) {
-            QString said = widget->accessibleName() + widget->toolTip();
+            QString said = widget->accessibleName() + widget->accessibleDescription() + widget->toolTip();
             if (button)
                 said += button->text();
             if (const auto* label = qobject_cast<const QLabel*>(widget))
                 said += label->text();
             if (const auto* box = qobject_cast<const QComboBox*>(widget))
-                said += box->placeholderText() + box->currentText();
+                said += box->placeholderText() + box->currentText() + rowsOf(*box->model());
+            if (const auto* line = qobject_cast<const QLineEdit*>(widget))
+                said += line->placeholderText();
+            if (const auto* list = qobject_cast<const QListWidget*>(widget))
+                said += rowsOf(*list->model());
             if (hasHebrew(said))
                 result += u"Hebrew on an English page: %1: %2"_s.arg(nameOf(*widget), said);
         }
