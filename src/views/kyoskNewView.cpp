@@ -302,8 +302,12 @@ void kyoskNewView::makeClosingPanel() {
     column->addWidget(facts);
     auto* coupon = new QHBoxLayout;
     coupon->setSpacing(theme().px(8));
-    coupon->addWidget(label(u"Label4kpn3Prompt"_s, m_page.Label4kpn3Prompt, "muted"));
-    coupon->addWidget(label(u"Label4kpn3"_s, m_page.Label4kpn3, "strong"), 1);
+    for (QLabel* part : {label(u"Label4kpn3Prompt"_s, m_page.Label4kpn3Prompt, "muted"),
+                         label(u"Label4kpn3"_s, m_page.Label4kpn3, "strong")}) {
+        part->setWordWrap(false);
+        coupon->addWidget(part);
+    }
+    coupon->addStretch(1);
     column->addLayout(coupon);
 
     auto* mailLine = new QHBoxLayout;

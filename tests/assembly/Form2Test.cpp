@@ -217,6 +217,15 @@ TEST_F(PreparingAPlainOrder, keepsTheOrderAtALocalStationAndTellsItsNumberOnTheS
     EXPECT_TRUE(machine.files.fileExists(logPath()));
 }
 
+TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) {
+    chain.registerPage(PageId::MoogMeret, [] { return std::make_unique<Page>(PageId::MoogMeret); });
+    state.TmunatPaar = 1;
+    state.Optint = 3;
+    openWith({line(givePicture(QStringLiteral("one.jpg")))}).Command6_Click();
+    EXPECT_EQ(front(), PageId::MoogMeret);
+    EXPECT_EQ(state.handOver.lines, QStringList(state.transfer.OrderLogBase));
+}
+
 TEST_F(PreparingAPlainOrder, tellsOfAPrintFileThatCanNotBeWrittenAndGoesOn) {
     const QString one = givePicture(QStringLiteral("one.jpg"));
     makeFolder(folder() + QStringLiteral("\\1 1015GNB0000_016F6E65.jpp"));
