@@ -44,6 +44,18 @@ public:
     virtual QString lastResponse() const = 0;
 };
 
+// What a POST carries besides its address.
+struct PostRequest {
+    enum class Version { Http10, Http11 };
+    Version version = Version::Http11;
+    QByteArray contentType;
+    QByteArray body;
+    // More than the body has: zeros follow it up to this length.
+    qint64 announcedLength = 0;
+    QString user; // with a password: sent along (Basic); else nothing is
+    QString password;
+};
+
 class Internet {
 public:
     virtual ~Internet() = default;
@@ -60,6 +72,9 @@ public:
     // GET, past every cache. The URL goes out as it stands, in the ANSI code page, only a blank as %20; CR, LF and NUL
     // count as blanks and "#" does not cut. The answer's body whatever the status is.
     virtual Result<QByteArray> fetch(const QString& url) = 0;
+
+    // POST to an address that goes out as that of fetch does. The answer's body whatever the status is.
+    virtual Result<QByteArray> post(const QString& url, const PostRequest& request) = 0;
 
     // GET into a file, written whole or not at all; an answer of another status than 200 to 299 is a failure and leaves
     // no file.

@@ -2,7 +2,7 @@
 
 #include "common/HostFile.h"
 #include "platform/BlockingCall.h"
-#include "platform/HttpGet.h"
+#include "platform/HttpCall.h"
 
 #include <ifaddrs.h>
 #include <net/if.h>
@@ -76,10 +76,14 @@ Result<std::unique_ptr<FtpConnection>> PocoInternet::connectFtp(const QString& h
     return std::unique_ptr<FtpConnection>(std::make_unique<WireConnection>(std::move(wire)));
 }
 
-Result<QByteArray> PocoInternet::fetch(const QString& url) {
+namespace {
+
+// The body of an answer, kept whole.
+template <class Call>
+Result<QByteArray> bodyOf(Call call) {
     return RunBlocking([&]() -> Result<QByteArray> {
         QByteArray body;
-        const auto status = HttpGet(url, m_limits, [&](const char* bytes, std::size_t count) {
+        const auto status = call([&](const char* bytes, std::size_t count) {
             body.append(bytes, static_cast<qsizetype>(count));
             return body.size() <= largestFetchedBody;
         });
@@ -87,6 +91,16 @@ Result<QByteArray> PocoInternet::fetch(const QString& url) {
             return status.failure();
         return body;
     });
+}
+
+} // namespace
+
+Result<QByteArray> PocoInternet::fetch(const QString& url) {
+    return bodyOf([&](const BodySink& sink) { return HttpGet(url, m_limits, sink); });
+}
+
+Result<QByteArray> PocoInternet::post(const QString& url, const PostRequest& request) {
+    return bodyOf([&](const BodySink& sink) { return HttpPost(url, request, m_limits, sink); });
 }
 
 Result<void> PocoInternet::download(const QString& url, const HostPath& target) {

@@ -17,6 +17,7 @@ public:
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
     Result<QByteArray> fetch(const QString& url) override;
+    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
     Result<void> download(const QString& url, const HostPath& target) override;
 
 private:

@@ -49,10 +49,13 @@ struct ClientProfile {
     QString SiteUrl; // ends in a slash
     QString PriceListUrl;
     QString PriceListUrl2;
-    QString ReportUrl;    // whole address of the report script
-    QString DoneUrl;      // whole address of the done script, FTP sender
-    QString HttpDoneUrl;  // the same for the HTTP sender, on a host of its own
-    QString SettingsHost; // host of the remote settings texts
+    QString ReportUrl;      // whole address of the report script
+    QString DoneUrl;        // whole address of the done script, FTP sender
+    QString HttpDoneUrl;    // the same for the HTTP sender, on a host of its own
+    QString HttpHost;       // web server of the HTTP sender, with its scheme and without a final slash; empty: none
+    QString HttpTikiya;     // site folder with its listing scripts and "uploads"
+    QString HttpScriptPath; // path of its upload scripts, begins and ends with a slash
+    QString SettingsHost;   // host of the remote settings texts
     QString AdUrl1;
     QString AdUrl2;
     QString AdFile1; // drive paths

@@ -88,6 +88,10 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
         {"[Paper]\nSizes = 00/15\n", {"Paper.Sizes"}},
         {"[Addresses]\nSite = http://a.example\n", {"Addresses.Site", "slash"}},
         {"[Addresses]\nReport = ftp://a.example/x\n", {"Addresses.Report", "http://"}},
+        {"[Addresses]\nHttpHost = upload.example\n", {"Addresses.HttpHost", "http://"}},
+        {"[Addresses]\nHttpHost = http://upload.example/\n", {"Addresses.HttpHost", "no slash"}},
+        {"[Addresses]\nHttpTikiya = /orders\n", {"Addresses.HttpTikiya", "no slash"}},
+        {"[Addresses]\nHttpScriptPath = /orders\n", {"Addresses.HttpScriptPath", "ends with a slash"}},
         {"[Switches]\nReports = perhaps\n", {"Switches.Reports", "\"perhaps\"", "yes or no"}},
         {"[Drives]\nOrder = EDE\n", {"Drives.Order", "once"}},
         {"[Drives]\nProgramLetter = Z\n", {"Drives.ProgramLetter"}},
@@ -122,9 +126,10 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     LoadDefaultProfile(builtIn, Deployment());
     const auto texts = [](const SessionState& s) {
         const ClientProfile& p = s.profile;
-        QStringList all = {p.FtpFolder1, p.FtpFolder2, p.ClientCode,  p.FtpServer,    p.FtpPassword, p.FtpUser,
-                           p.LabName1,   p.LabName2,   p.LabMail,     p.LabPhone,     p.SiteUrl,     p.PriceListUrl,
-                           p.ReportUrl,  p.DoneUrl,    p.HttpDoneUrl, p.SettingsHost, p.ClientLetter};
+        QStringList all = {p.FtpFolder1,   p.FtpFolder2,   p.ClientCode, p.FtpServer,  p.FtpPassword,
+                           p.FtpUser,      p.LabName1,     p.LabName2,   p.LabMail,    p.LabPhone,
+                           p.SiteUrl,      p.PriceListUrl, p.ReportUrl,  p.DoneUrl,    p.HttpDoneUrl,
+                           p.SettingsHost, p.ClientLetter, p.HttpHost,   p.HttpTikiya, p.HttpScriptPath};
         for (const QString& size : p.SizeList)
             all += size;
         for (const QString& size : p.QuickSizes)

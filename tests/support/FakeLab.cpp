@@ -146,6 +146,11 @@ Result<QByteArray> FakeLab::fetch(const QString& url) {
     return QByteArray("ok");
 }
 
+Result<QByteArray> FakeLab::post(const QString& url, const PostRequest&) {
+    urls += url;
+    return QByteArray("ok");
+}
+
 Result<void> FakeLab::download(const QString& url, const HostPath& target) {
     urls += url;
     std::ofstream(target, std::ios::binary) << "ok";

@@ -55,6 +55,7 @@ public:
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
     Result<QByteArray> fetch(const QString& url) override;
+    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
     Result<void> download(const QString& url, const HostPath& target) override;
 
     DataChannel lastChannel = DataChannel::Passive;

@@ -34,6 +34,9 @@ public:
     // What the account sees as "/", and the folder that orders arrive in.
     HostPath account() const { return folder() / "ftp"; }
     HostPath ordersFolder() const { return account() / "zalamim234"; }
+    // The folder that orders arrive in which come by HTTP, and the lab's site folder for them.
+    HostPath uploads() const { return folder() / "uploads"; }
+    static QString siteFolder() { return QStringLiteral("hazmanot"); }
     HostPath folder() const { return toHostPath(m_folder.path()); }
     HostPath labFile() const { return folder() / "lab.ini"; }
 

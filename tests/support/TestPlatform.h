@@ -101,6 +101,7 @@ public:
         return noLine();
     }
     Result<QByteArray> fetch(const QString&) override { return noLine(); }
+    Result<QByteArray> post(const QString&, const PostRequest&) override { return noLine(); }
     Result<void> download(const QString&, const HostPath&) override { return noLine(); }
 
 private:

@@ -18,6 +18,9 @@ using BodySink = std::function<bool(const char* bytes, std::size_t count)>;
 // GET past every cache; the status code. A body that ends before its announced length is a failure. http only.
 Result<int> HttpGet(const QString& url, const TimeLimits& limits, const BodySink& sink);
 
+// POST; the status code. The body goes out from where it lies, in pieces, and is never copied whole.
+Result<int> HttpPost(const QString& url, const PostRequest& post, const TimeLimits& limits, const BodySink& sink);
+
 // The request target as it goes over the wire: the ANSI bytes of the text from behind the host on, CR, LF and NUL made
 // blanks, a blank made %20, since a raw one would end the target in the request line. Nothing else is touched.
 QByteArray HttpTarget(const QString& pathAndQuery);

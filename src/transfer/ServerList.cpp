@@ -1,0 +1,60 @@
+#include "transfer/ServerList.h"
+
+#include "common/DrivePathText.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+namespace {
+
+constexpr qsizetype longestAnswer = 35;
+const QString total = QStringLiteral("total:");
+
+bool namesTotal(const QString& entry) {
+    return entry.contains(total, Qt::CaseInsensitive);
+}
+
+} // namespace
+
+QStringList ParseServerList(const QString& text) {
+    const QString whole = text.trimmed();
+    if (whole.size() <= longestAnswer)
+        return {};
+    QStringList entries = whole.split(QStringLiteral("~~"));
+    entries.removeIf([](const QString& entry) { return entry.trimmed().isEmpty(); });
+    return entries;
+}
+
+QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName) {
+    QStringList missing = files;
+    for (const QString& given : entries) {
+        const QString entry = given.trimmed().toLower();
+        if (namesTotal(entry) || entry == folderName.toLower())
+            continue;
+        const auto arrived = std::find_if(missing.begin(), missing.end(), [&](const QString& path) {
+            return LeafName(path).trimmed().toLower().contains(entry);
+        });
+        if (arrived != missing.end())
+            missing.erase(arrived);
+    }
+    return missing;
+}
+
+ServerVerdict JudgeServerList(const QString& answer, const QString& folderName) {
+    if (answer.contains(QStringLiteral("not"), Qt::CaseInsensitive))
+        return ServerVerdict::NotVerified;
+    const QStringList entries = ParseServerList(answer);
+    const bool named = std::any_of(entries.begin(), entries.end(),
+                                   [&](const QString& entry) { return entry.trimmed() == folderName; });
+    const bool counted = std::any_of(entries.begin(), entries.end(), namesTotal);
+    return named && counted ? ServerVerdict::Listed : ServerVerdict::NotVerified;
+}
+
+QString ListFileName(int number) {
+    if (number < 0 || number > 3)
+        return {};
+    return number == 0 ? QStringLiteral("filelisthom.txt") : QStringLiteral("filelisthom%1.txt").arg(number);
+}
+
+} // namespace lumora

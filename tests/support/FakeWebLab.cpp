@@ -1,0 +1,87 @@
+#include "support/FakeWebLab.h"
+
+#include "common/AnsiCodePage.h"
+
+#include <fstream>
+
+namespace lumora {
+
+namespace {
+
+bool strikes(int& counter) {
+    if (counter > 0)
+        --counter;
+    else if (counter != FakeLab::always)
+        return false;
+    return true;
+}
+
+Failure down() {
+    return {Failure::Kind::Disconnected, QStringLiteral("nobody answers")};
+}
+
+// The text between two marks.
+QString between(const QString& text, const QString& from, const QString& to) {
+    const qsizetype at = text.indexOf(from) + from.size();
+    return text.mid(at, text.indexOf(to, at) - at);
+}
+
+} // namespace
+
+QByteArray FakeWebLab::listOf(const QString& folder) const {
+    if (listInstead)
+        return *listInstead;
+    QStringList entries{folder};
+    for (const auto& [name, bytes] : uploads.at(folder))
+        entries += name;
+    entries += QStringLiteral("total:%1").arg(entries.size() - 1);
+    return AnsiCodePage::encode(entries.join(QStringLiteral("~~")));
+}
+
+Result<QByteArray> FakeWebLab::fetch(const QString& url) {
+    urls += url;
+    if (strikes(deadCalls))
+        return down();
+    if (!url.contains(QStringLiteral("listfileb.php"))) {
+        reports += url;
+        return QByteArray("OK");
+    }
+    const QString folder = url.mid(url.indexOf(QStringLiteral("tik=")) + 4);
+    if (!uploads.contains(folder))
+        return QByteArray("folder not found");
+    m_listed.insert(folder);
+    return QByteArray("ok");
+}
+
+Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& request) {
+    urls += url;
+    posts.push_back(request);
+    const QString head = AnsiCodePage::decode(request.body.left(400));
+    const QString name = between(head, QStringLiteral("filename=\""), QStringLiteral("\";"));
+    posted += name;
+    if (onPost)
+        onPost(name);
+    if (strikes(deadPosts))
+        return down();
+    const QString folder = between(url, QStringLiteral("folder="), QStringLiteral("&"));
+    const qsizetype from = request.body.indexOf("\r\n\r\n") + 4;
+    const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
+    uploads[folder];
+    if (!strikes(losses[name]))
+        uploads[folder][name] = request.body.mid(from, end - from);
+    return QByteArray("stored");
+}
+
+Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {
+    urls += url;
+    if (strikes(deadCalls))
+        return down();
+    const QString folder = between(url, QStringLiteral("/uploads/"), QStringLiteral("/filelist"));
+    if (refusesLists || !m_listed.contains(folder))
+        return Failure{Failure::Kind::Refused, QStringLiteral("404")};
+    const QByteArray list = listOf(folder);
+    std::ofstream(target, std::ios::binary).write(list.constData(), list.size());
+    return {};
+}
+
+} // namespace lumora

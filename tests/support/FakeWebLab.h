@@ -1,0 +1,35 @@
+#pragma once
+
+#include "support/FakeLab.h"
+
+#include <set>
+
+namespace lumora {
+
+// The lab's web site in memory: takes files, writes lists, and hears reports. The faults are those of a line and of a
+// script that answers with something else.
+class FakeWebLab : public FakeLab {
+public:
+    std::map<QString, Folder> uploads; // by order folder
+    std::vector<PostRequest> posts;    // as they came
+    QStringList posted;                // names, also of posts that failed
+    QStringList reports;               // addresses of calls that are no upload and no list
+
+    int deadPosts = 0;                     // posts that reach nobody; always is for good
+    int deadCalls = 0;                     // the same of fetches and downloads
+    std::map<QString, int> losses;         // how often a file is accepted and not stored
+    std::optional<QByteArray> listInstead; // what each list file says
+    bool refusesLists = false;             // no list file is given out
+    std::function<void(const QString& name)> onPost;
+
+    Result<QByteArray> fetch(const QString& url) override;
+    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<void> download(const QString& url, const HostPath& target) override;
+
+    QByteArray listOf(const QString& folder) const;
+
+private:
+    std::set<QString> m_listed; // folders whose list was asked for
+};
+
+} // namespace lumora

@@ -1,0 +1,174 @@
+#include "support/FakeWebLab.h"
+#include "support/UploadFormRig.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+const QString threeAttempts = QStringLiteral("לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה");
+
+struct UploadFormTest : ::testing::Test {
+    FakeWebLab lab;
+    UploadFormRig rig{lab};
+
+    bool arrived() const {
+        const auto found = lab.uploads.find(UploadFormRig::name());
+        return found != lab.uploads.end() && found->second == rig.localFiles();
+    }
+};
+
+TEST_F(UploadFormTest, SendsEachFileOnceAndReportsOnce) {
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(arrived());
+    EXPECT_TRUE(page.done);
+    EXPECT_EQ(lab.posted.size(), 5);
+    EXPECT_EQ(page.Label16.text, UploadFormRig::name());
+    EXPECT_TRUE(page.Picture6.visible);
+    EXPECT_EQ(page.percent, 100);
+    ASSERT_EQ(lab.reports.size(), 2);
+    EXPECT_TRUE(lab.reports[0].startsWith(
+        QStringLiteral("http://192.0.2.10/aaaqamootreport/padd.asp?k1=tarvelmond&t1=") + UploadFormRig::name()));
+    EXPECT_EQ(lab.reports[1], QStringLiteral("http://192.0.2.11/aaasssppp/p.asp?t1=tarvelmond&t2=true"));
+    EXPECT_TRUE(rig.test.files.fileExists(QStringLiteral("C:\\2000lumora\\filelist1.txt")));
+}
+
+TEST_F(UploadFormTest, AResendIsNotReportedAndAnOrderThatIsThereIsNotSent) {
+    rig.state.transfer.SugMishloah = 1;
+    rig.send();
+    EXPECT_TRUE(arrived());
+    EXPECT_EQ(lab.reports, QStringList());
+    rig.page().Command2_Click();
+    EXPECT_TRUE(rig.page().done);
+    EXPECT_TRUE(rig.page().Label11.visible);
+    EXPECT_FALSE(rig.page().Timer1.running());
+    EXPECT_EQ(lab.posted.size(), 5);
+}
+
+TEST_F(UploadFormTest, OnlyWhatTheListLacksGoesAgain) {
+    lab.losses = {{UploadFormRig::second(), 1}, {UploadFormRig::log(), 2}};
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(arrived());
+    EXPECT_EQ(lab.posted.size(), 5 + 2 + 1);
+    EXPECT_EQ(lab.urls.filter(QStringLiteral("filelisthom2.txt")).size(), 1) << "two were missing";
+}
+
+TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
+    const struct {
+        const char* fault;
+        std::function<void(FakeWebLab&)> set;
+        bool done;
+        int posted; // in all attempts
+    } cases[] = {
+        {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15},
+        {"no list is given out", [](FakeWebLab& l) { l.refusesLists = true; }, false, 15},
+        {"a list without a total",
+         [](FakeWebLab& l) { l.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"; }, false, 15},
+        {"a short list", [](FakeWebLab& l) { l.listInstead = "total:5"; }, false, 15},
+        {"four files lost, so that no list has their number",
+         [](FakeWebLab& l) {
+             l.losses = {{UploadFormRig::log(), 1},
+                         {UploadFormRig::first(), 1},
+                         {UploadFormRig::second(), 1},
+                         {UploadFormRig::third(), 1}};
+         },
+         false, 14},
+        // The load's check takes three calls, that of an attempt three.
+        {"the server is back at the second attempt",
+         [](FakeWebLab& l) {
+             l.deadCalls = 3;
+             l.deadPosts = 2;
+         },
+         true, 7},
+    };
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.fault);
+        FakeWebLab faulty;
+        UploadFormRig other(faulty);
+        c.set(faulty);
+        UploadForm& page = other.send();
+        EXPECT_EQ(page.done, c.done);
+        EXPECT_EQ(page.failed, !c.done);
+        EXPECT_EQ(page.Image5.visible, !c.done);
+        EXPECT_EQ(page.Label1.text, c.done ? QString() : threeAttempts);
+        EXPECT_EQ(faulty.reports.isEmpty(), !c.done);
+        EXPECT_EQ(other.localFiles().size(), 5u);
+        EXPECT_EQ(faulty.posted.size(), c.posted);
+    }
+}
+
+TEST_F(UploadFormTest, SendAgainBeginsAnewWithThreeAttempts) {
+    lab.deadPosts = FakeLab::always;
+    UploadForm& page = rig.send();
+    ASSERT_TRUE(page.failed);
+    EXPECT_TRUE(page.Label4Reason.visible);
+    EXPECT_EQ(page.Label12.text, QStringLiteral("5"));
+    lab.deadPosts = 0;
+    lab.posted.clear();
+    page.Image5_Click();
+    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(arrived());
+    EXPECT_EQ(lab.posted.size(), 5);
+    EXPECT_EQ(lab.reports.size(), 2);
+}
+
+TEST_F(UploadFormTest, StopHoldsTheCountAndContinueTakesItUp) {
+    UploadForm& page = rig.start();
+    EXPECT_TRUE(page.Timer1.running());
+    page.Command3_Click();
+    EXPECT_FALSE(page.Timer1.running() || page.Timer2.running() || page.Picture1.visible || page.Command3.visible);
+    EXPECT_TRUE(page.Command10.visible);
+    page.Timer2_Tick();
+    EXPECT_TRUE(lab.posted.isEmpty());
+    page.Command10_Click();
+    EXPECT_FALSE(page.Command10.visible);
+    rig.countDown();
+    EXPECT_TRUE(arrived());
+}
+
+TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
+    rig.write(UploadFormRig::list(),
+              UploadFormRig::name().toLatin1() + "~~!105_1234.jpg~~" + UploadFormRig::first().toLatin1() + "~~total:2");
+    lab.refusesLists = true;
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.failed);
+    EXPECT_EQ(page.List4Kvazim.count(), 5);
+    EXPECT_FALSE(lab.posted.contains(UploadFormRig::list()));
+    EXPECT_FALSE(rig.test.files.fileExists(UploadFormRig::folder() + u'\\' + UploadFormRig::list()));
+}
+
+TEST_F(UploadFormTest, SaysWhenThereIsNothingToSendOrNobodyToSendTo) {
+    rig.state.profile.HttpHost.clear();
+    EXPECT_TRUE(rig.start().failed);
+    EXPECT_FALSE(rig.page().Timer1.running());
+    FakeWebLab other;
+    UploadFormRig empty(other);
+    empty.state.transfer.OrderFolder = QStringLiteral("C:\\");
+    EXPECT_TRUE(empty.start().failed);
+    EXPECT_TRUE(lab.urls.isEmpty() && other.urls.isEmpty());
+}
+
+TEST_F(UploadFormTest, NothingMoreIsSentOnceThePageIsLeft) {
+    lab.onPost = [&](const QString&) { rig.page().Image3_Click(); };
+    rig.send();
+    EXPECT_EQ(lab.posted.size(), 1);
+    EXPECT_TRUE(rig.chain.hasEnded());
+}
+
+TEST_F(UploadFormTest, CheckingTheServerNeedsTheFirstFileInTheOrdersFolder) {
+    UploadForm& page = rig.send();
+    ASSERT_TRUE(page.done);
+    page.Command7_Click();
+    EXPECT_EQ(page.TxtWeb.text, QStringLiteral("1"));
+    page.List4Kvazim.clear();
+    page.List4Kvazim.append(QStringList{QStringLiteral("C:\\elsewhere\\a.jpp")});
+    page.Command7_Click();
+    EXPECT_EQ(page.TxtWeb.text, QStringLiteral("-1"));
+    page.List4Kvazim.clear();
+    page.Command7_Click();
+    EXPECT_EQ(page.TxtWeb.text, QStringLiteral("-1"));
+}
+
+} // namespace
+} // namespace lumora
