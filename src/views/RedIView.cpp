@@ -11,6 +11,8 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
+#include <QSignalBlocker>
+#include <QSlider>
 #include <QStyle>
 #include <QVBoxLayout>
 
@@ -56,8 +58,7 @@ RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     auto* work = new QVBoxLayout;
     work->setSpacing(theme.px(10));
     work->addWidget(m_canvas, 1);
-    m_readout = makeLabel(this, "smallMuted");
-    work->addWidget(m_readout);
+    work->addWidget(makeOperator());
     work->addLayout(makeTools());
     row->addLayout(work, 1);
     frame().content()->addLayout(row, 1);
@@ -221,6 +222,32 @@ QLayout* RedIView::makeTools() {
     return row;
 }
 
+// What the lab's people work and read; customers never see it.
+QWidget* RedIView::makeOperator() {
+    RedI& page = m_page;
+    m_operator = new QWidget(this);
+    auto* column = new QVBoxLayout(m_operator);
+    column->setContentsMargins(0, 0, 0, 0);
+    auto* readings = new QHBoxLayout;
+    auto* row = new QHBoxLayout;
+    column->addLayout(readings);
+    column->addLayout(row);
+    m_readout = makeLabel(m_operator, "smallMuted");
+    readings->addWidget(m_readout, 1);
+    m_check = makeLabel(m_operator, "small");
+    m_check->setAutoFillBackground(true);
+    bind(u"Label6"_s, m_check, [&page] { return page.Label6.text; });
+    readings->addWidget(m_check);
+    m_level = new QSlider(Qt::Horizontal, m_operator);
+    m_level->setRange(0, RedI::HScroll1Max);
+    connect(m_level, &QSlider::valueChanged, this, [&page](int value) { page.HScroll1_Change(value); });
+    bind(u"HScroll1"_s, m_level, [&page] { return QString::number(page.HScroll1); });
+    row->addWidget(m_level, 1);
+    row->addWidget(button(u"Command13"_s, page.Command13, Role::Quiet, [&page] { page.Command13_Click(); }));
+    row->addWidget(button(u"Command6"_s, page.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
+    return m_operator;
+}
+
 void RedIView::makeMenu() {
     RedI& page = m_page;
     m_menu = new Overlay(theme(), this);
@@ -279,14 +306,12 @@ void RedIView::bindTheRest() {
     bindHidden(u"kofez"_s, page.kofez);
     bindHidden(u"RedTargetRectangle"_s, page.RedTargetRectangle);
     bindHidden(u"Image1"_s, page.Image1);
-    bindHidden(u"Command6"_s, page.Command6);
-    bindHidden(u"Command13"_s, page.Command13);
     const std::pair<const char*, const Caption*> operators[] = {
-        {"Label1", &page.Label1},   {"Label2", &page.Label2},   {"Label3", &page.Label3},   {"Label6", &page.Label6},
-        {"Label12", &page.Label12}, {"Label13", &page.Label13}, {"Label16", &page.Label16}, {"Label17", &page.Label17},
-        {"Label24", &page.Label24}, {"Label25", &page.Label25}, {"Label27", &page.Label27}, {"Label28", &page.Label28},
-        {"Label30", &page.Label30}, {"Label31", &page.Label31}, {"Label37", &page.Label37}, {"Label42", &page.Label42},
-        {"Label43", &page.Label43}, {"Rlbl", &page.Rlbl},       {"Glbl", &page.Glbl},       {"Blbl", &page.Blbl}};
+        {"Label1", &page.Label1},   {"Label2", &page.Label2},   {"Label3", &page.Label3},   {"Label12", &page.Label12},
+        {"Label13", &page.Label13}, {"Label16", &page.Label16}, {"Label17", &page.Label17}, {"Label24", &page.Label24},
+        {"Label25", &page.Label25}, {"Label27", &page.Label27}, {"Label28", &page.Label28}, {"Label30", &page.Label30},
+        {"Label31", &page.Label31}, {"Label37", &page.Label37}, {"Label42", &page.Label42}, {"Label43", &page.Label43},
+        {"Rlbl", &page.Rlbl},       {"Glbl", &page.Glbl},       {"Blbl", &page.Blbl}};
     for (const auto& [name, caption] : operators)
         bindHidden(QString::fromLatin1(name), *caption);
     bindList(u"List1"_s, page.List1);
@@ -351,10 +376,21 @@ void RedIView::render() {
     }
     m_busy->setVisible(m_page.Label4Busy.visible);
     m_notice->setVisible(m_page.Label45.visible);
-    m_readout->setVisible(state().DegelEdit);
-    m_readout->setText(isolated(u"R %1 G %2 B %3 · %4 − %5 = %6 · %7"_s.arg(
+    m_operator->setVisible(state().DegelEdit);
+    m_readout->setText(isolated(u"R %1 G %2 B %3 · %4 − %5 = %6 · %7 | %8"_s.arg(
         m_page.Rlbl.text, m_page.Glbl.text, m_page.Blbl.text, m_page.Label3.text, m_page.Label12.text,
-        m_page.Label24.text, m_page.Label28.text)));
+        m_page.Label24.text, m_page.Label28.text,
+        QStringList{m_page.Label25.text, m_page.Label30.text, m_page.Label31.text, m_page.Label37.text,
+                    m_page.Label42.text, m_page.Label43.text}
+            .join(u" · "_s))));
+    QPalette check = palette();
+    if (m_page.Label6Order != RedI::Order::Unknown)
+        check.setColor(QPalette::Window,
+                       m_page.Label6Order == RedI::Order::InOrder ? Theme::Colour::GoodSoft : Theme::Colour::SunSoft);
+    m_check->setPalette(check);
+    const QSignalBlocker quiet(m_level);
+    m_level->setValue(m_page.HScroll1);
+    speak(m_level, m_page.Label37.text);
     m_helpText->setText(
         isolated(m_page.Label41.text + u'\n' + m_page.Label44.text.trimmed() + u'\n' + m_page.Label45.text.trimmed()));
     m_menu->setOpen(m_page.kofez.visible);

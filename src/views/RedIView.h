@@ -7,6 +7,7 @@
 #include <vector>
 
 class QFrame;
+class QSlider;
 
 namespace lumora {
 
@@ -30,6 +31,7 @@ private:
     QWidget* makeSide();
     QLayout* makePad();
     QLayout* makeTools();
+    QWidget* makeOperator();
     // A button that shows its sign alone; the words are its hint and its spoken meaning.
     void bindSign(const QString& name, QPushButton* button, const QString& icon, const Caption& caption);
     // A label of instructions; the blanks at the ends of its lines are not shown.
@@ -57,7 +59,10 @@ private:
     QLabel* m_guide = nullptr;
     QFrame* m_busy = nullptr;
     QFrame* m_notice = nullptr;
+    QWidget* m_operator = nullptr;
     QLabel* m_readout = nullptr;
+    QLabel* m_check = nullptr;
+    QSlider* m_level = nullptr;
     QLabel* m_helpText = nullptr;
     Overlay* m_menu = nullptr;
     Overlay* m_help = nullptr;

@@ -194,6 +194,22 @@ TEST_P(RedEyeHands, FollowsADragAndStopsAHoldWhenThePointerGoes) {
     EXPECT_FALSE(walk.program().chain().find(PageId::RedI));
 }
 
+TEST_P(RedEyeHands, GivesTheLabsOperatorTheBarAndTheReadings) {
+    EXPECT_FALSE(walk.pressable(u"RedI"_s, u"HScroll1"_s)) << "not for customers";
+    walk.program().state().DegelEdit = true;
+    pressOverview(eye);
+    press(u"Command13"_s);
+    press(u"Command6"_s);
+    EXPECT_GT(page().RedPeakValue, 200);
+    press(u"Image2"_s);
+    control(u"HScroll1"_s).setFocus();
+    QTest::keyClick(&control(u"HScroll1"_s), Qt::Key_Home);
+    QTest::keyClick(&control(u"HScroll1"_s), Qt::Key_PageUp);
+    EXPECT_GT(page().RedFixLevel, 0);
+    EXPECT_EQ(page().RedFixLevel, 10 * page().HScroll1);
+    look(u"redi-8-operator"_s);
+}
+
 INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView,
                          ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
                                            Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
