@@ -5,6 +5,7 @@
 
 #include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
+#include "imaging/PictureMemory.h"
 #include "session/SessionState.h"
 
 #include <QGuiApplication>
@@ -40,6 +41,7 @@ EditFields recordOf(const Job& job) {
 } // namespace
 
 int main(int argc, char** argv) {
+    keepPictureMemory();
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const Job job = Job::of(argc, argv);
     const std::string mode = argv[2];

@@ -9,6 +9,7 @@
 #include "editing/EditedPicture.h"
 #include "editing/gdisave.h"
 #include "imaging/BmpFile.h"
+#include "imaging/PictureMemory.h"
 #include "platform/QtEventPump.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -275,6 +276,7 @@ int peakMemory(Kind kind, int pictures) {
 } // namespace
 
 int main(int argc, char** argv) {
+    keepPictureMemory();
     QGuiApplication application(argc, argv);
     QStringList arguments = QCoreApplication::arguments();
     const Kind kind = arguments.removeAll(QStringLiteral("edited")) > 0 ? Kind::Edited : Kind::Plain;

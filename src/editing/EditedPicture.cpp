@@ -44,9 +44,9 @@ PictureCaption captionOf(const EditFields& edit) {
     return caption;
 }
 
-// What lies over the picture, in preview and print alike. A null bitmap is left out.
-void drawOver(Bitmap& paper, const Bitmap& keyedFrame, const CaptionInk& ink) {
-    drawKeyedFrame(paper, keyedFrame);
+// What lies over the picture, in preview and print alike. What is empty is left out.
+void drawOver(Bitmap& paper, const KeyedFrame& frame, const CaptionInk& ink) {
+    drawKeyedFrame(paper, frame);
     drawInk(paper, ink);
 }
 
@@ -213,17 +213,11 @@ void EditedPreview::prepareOverlay(const EditFields& edit, const std::optional<B
     if (!frame) {
         m_overlay.frame = {};
         m_overlay.frameKey = 0;
-    } else if (m_overlay.frame.isNull() || m_overlay.frameKey != frame->image().cacheKey()) {
+    } else if (m_overlay.frameKey != frame->image().cacheKey()) {
         m_overlay.frame = keyedFrame(*frame, size);
         m_overlay.frameKey = frame->image().cacheKey();
     }
-    if (edit.TextOn != 1) {
-        m_overlay.ink = {};
-        m_overlay.caption = {};
-    } else if (const PictureCaption caption = captionOf(edit); m_overlay.caption != caption) {
-        m_overlay.ink = inkOf(caption, size, {scale, scale});
-        m_overlay.caption = caption;
-    }
+    m_overlay.ink = edit.TextOn == 1 ? m_overlay.inks.inkOf(captionOf(edit), size, {scale, scale}) : CaptionInk();
 }
 
 Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale) {
@@ -288,10 +282,13 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
     if (picture.image().format() != QImage::Format_RGB32)
         picture = onWhite(picture);
     const Bitmap whole = within(picture, QRect(-part.topLeft(), QSize(wanted.width, wanted.height)));
-    Bitmap paper = stretched ? resampled(whole, geometry.size)
-                             : Bitmap(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
+    Bitmap paper(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
     if (paper.isNull())
         return noRoom(print.file, geometry.size);
+    if (stretched) {
+        for (const QRect& bare : placement.uncovered(geometry.size))
+            drawStretched(paper, whole, bare);
+    }
     if (shows && wanted == reducedSize(*size, placement)) {
         coloursOf(edit).apply(picture);
         drawPlacedPart(paper, picture, part, wanted, placement);
@@ -299,7 +296,7 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
         drawPlaced(paper, whole, placement, coloursOf(edit));
     }
     const auto frame = loadFrame(print.framesFolder, edit, FrameUse::Print);
-    drawOver(paper, frame ? keyedFrame(*frame, geometry.size) : Bitmap(),
+    drawOver(paper, frame ? keyedFrame(*frame, geometry.size) : KeyedFrame(),
              edit.TextOn == 1 ? inkOf(captionOf(edit), geometry.size, {geometry.scaleX, geometry.scaleY})
                               : CaptionInk());
     watch.add(&PictureTimes::draw);

@@ -53,8 +53,8 @@ public:
 
     // In the box's size times scale, rounded; every number of pixels in the record is multiplied by it, as the print
     // does. frame as loadFrame gives it, or none. What a tick leaves as it was is kept for the next one: the stretched
-    // frame as long as the very same bitmap comes (so keep it rather than loading it each time), the caption as long as
-    // its fields stay.
+    // frame as long as the very same bitmap comes (so keep it rather than loading it each time), the caption as
+    // CaptionInks says.
     Bitmap render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale = 1);
 
 private:
@@ -65,8 +65,8 @@ private:
         double scale = 0;
         Bitmap background;
         std::int64_t frameKey = 0;
-        Bitmap frame;
-        PictureCaption caption;
+        KeyedFrame frame;
+        CaptionInks inks;
         CaptionInk ink;
     };
     const Bitmap& sourceFor(double scale) const { return scale > 1 && !m_sharp.isNull() ? m_sharp : m_work; }

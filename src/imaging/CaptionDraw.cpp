@@ -6,13 +6,14 @@
 #include <QFontMetricsF>
 #include <QGlyphRun>
 #include <QPainter>
-#include <QPainterPath>
 #include <QRawFont>
 #include <QTextLayout>
 #include <QTextOption>
 #include <QTransform>
 
 #include <algorithm>
+#include <cmath>
+#include <optional>
 
 namespace lumora {
 namespace {
@@ -51,22 +52,19 @@ OutlinedLine outlined(const QString& text, const QFont& font) {
     return result;
 }
 
-} // namespace
-
-CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale) {
+// The caption around its anchor, in layout pixels.
+QPainterPath outlinesOf(const PictureCaption& caption) {
+    QPainterPath block;
     const QString family = installedFamily(caption.family);
-    if (family.isEmpty() || caption.text.isEmpty())
-        return {};
+    if (family.isEmpty())
+        return block;
     QFont font(family);
     font.setPixelSize(layoutSize);
     font.setBold(caption.bold);
     font.setItalic(caption.italic);
     font.setHintingPreference(QFont::PreferNoHinting);
     const QFontMetricsF metrics(font);
-
     const double em = layoutSize;
-    QPainterPath block;
-    block.setFillRule(Qt::WindingFill); // letters that overlap must not cut holes
     double top = 0;
     for (QString text : caption.text.split(u'\n')) {
         text.remove(u'\r');
@@ -78,20 +76,30 @@ CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale sc
         block.addPath(line.path.translated(left + em / 6, top + metrics.ascent()));
         top += metrics.lineSpacing();
     }
-    block.setFillRule(Qt::WindingFill);
+    block.setFillRule(Qt::WindingFill); // letters that overlap must not cut holes
+    return block;
+}
 
-    const double size = std::max(8, caption.emSize) * scale.x / em;
-    const auto placed = [&](double x, double y) {
-        QTransform place = QTransform::fromTranslate(x * scale.x, y * scale.y);
+bool sameOutlines(const PictureCaption& a, const PictureCaption& b) {
+    return a.text == b.text && a.family == b.family && a.bold == b.bold && a.italic == b.italic && a.align == b.align;
+}
+
+// Shadow and text on the pixels within limit; anchor is where the shadow stands.
+CaptionInk painted(const PictureCaption& caption, const QPainterPath& outlines, QPointF anchor, PaperScale scale,
+                   const std::optional<QRect>& limit) {
+    const double size = std::max(8, caption.emSize) * scale.x / layoutSize;
+    const auto placed = [&](QPointF at) {
+        QTransform place = QTransform::fromTranslate(at.x(), at.y());
         if (caption.run == PictureCaption::Run::Down)
             place.rotate(90);
         place.scale(size, size);
-        return place.map(block);
+        return place.map(outlines);
     };
-    const QPainterPath shadow = placed(caption.x, caption.y);
-    const QPainterPath text = placed(caption.x - 2, caption.y - 2);
-    const QRect shown = (shadow.controlPointRect() | text.controlPointRect()).toAlignedRect().adjusted(-1, -1, 1, 1) &
-                        QRect(0, 0, paper.width, paper.height);
+    const QPainterPath shadow = placed(anchor);
+    const QPainterPath text = placed(anchor - QPointF(2 * scale.x, 2 * scale.y));
+    QRect shown = (shadow.controlPointRect() | text.controlPointRect()).toAlignedRect().adjusted(-1, -1, 1, 1);
+    if (limit)
+        shown &= *limit;
     CaptionInk ink{Bitmap(shown.width(), shown.height(), Qt::transparent), shown.topLeft()};
     if (ink.pixels.isNull())
         return {};
@@ -101,6 +109,45 @@ CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale sc
     painter.fillPath(shadow, QColor(40, 40, 40, 180));
     painter.fillPath(text, caption.colour);
     return ink;
+}
+
+} // namespace
+
+CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale) {
+    const QPainterPath outlines = outlinesOf(caption);
+    if (outlines.isEmpty())
+        return {};
+    return painted(caption, outlines, {caption.x * scale.x, caption.y * scale.y}, scale,
+                   QRect(0, 0, paper.width, paper.height));
+}
+
+CaptionInk CaptionInks::inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale) {
+    if (!sameOutlines(caption, m_caption) || m_outlines.isEmpty()) {
+        m_outlines = outlinesOf(caption);
+        m_around = {};
+    }
+    const QPointF anchor(caption.x * scale.x, caption.y * scale.y);
+    const QPoint pixel(static_cast<int>(std::floor(anchor.x())), static_cast<int>(std::floor(anchor.y())));
+    const QPointF part = anchor - pixel;
+    PictureCaption moved = m_caption;
+    moved.x = caption.x;
+    moved.y = caption.y;
+    const bool asBefore = moved == caption && m_scale == scale && m_part == part;
+    m_caption = caption;
+    m_scale = scale;
+    m_part = part;
+    if (m_outlines.isEmpty())
+        return {};
+    if (!asBefore || m_around.pixels.isNull()) {
+        const double size = std::max(8, caption.emSize) * scale.x / layoutSize;
+        const QSizeF extent = m_outlines.controlPointRect().size() * size;
+        if (extent.width() * extent.height() > double(paper.width) * paper.height) {
+            m_around = {};
+            return painted(caption, m_outlines, anchor, scale, QRect(0, 0, paper.width, paper.height));
+        }
+        m_around = painted(caption, m_outlines, part, scale, std::nullopt);
+    }
+    return {m_around.pixels, m_around.at + pixel};
 }
 
 void drawInk(Bitmap& paper, const CaptionInk& ink) {

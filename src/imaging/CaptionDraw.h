@@ -4,6 +4,7 @@
 #include "imaging/PictureFile.h"
 
 #include <QColor>
+#include <QPainterPath>
 #include <QPoint>
 #include <QString>
 
@@ -31,6 +32,7 @@ struct PictureCaption {
 struct PaperScale {
     double x = 1;
     double y = 1;
+    bool operator==(const PaperScale&) const = default;
 };
 
 // A caption in pixels: its shadow at the anchor, the text over it 2 pixels up and to the left. A line is its advance
@@ -44,6 +46,20 @@ struct CaptionInk {
 
 // Needs a QGuiApplication.
 CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale = {});
+
+// The same for a caption that is asked for again and again while it is moved and sized: the outlines are made anew only
+// for other words or another face, the pixels not for a move by whole pixels of the paper.
+class CaptionInks {
+public:
+    CaptionInk inkOf(const PictureCaption& caption, PictureSize paper, PaperScale scale = {});
+
+private:
+    PictureCaption m_caption;
+    QPainterPath m_outlines; // for the caption's text, family, style and lines; around its anchor, in layout pixels
+    PaperScale m_scale;
+    QPointF m_part;      // the anchor's fraction of a pixel when the pixels were made
+    CaptionInk m_around; // the whole caption, placed from the anchor's pixel; null if it is far larger than the paper
+};
 
 void drawInk(Bitmap& paper, const CaptionInk& ink);
 

@@ -167,8 +167,6 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
     const double stepU = inverse.turn.cosine;
     const double stepV = -inverse.turn.sine;
     const double outer = level ? 0.0 : 0.5; // how far coverage reaches past the edge
-    std::vector<std::uint32_t> samples(static_cast<std::size_t>(size.width));
-
     for (int y = 0; y < size.height; ++y) {
         const double startU = inverse.u(0, y + 0.5);
         const double startV = inverse.v(0, y + 0.5);
@@ -189,25 +187,61 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
         const double half = 1.0 / 512.0;
         const SampleLine line{fixed(u * scaleX - 0.5 - corner.x() + half), fixed(v * scaleY - 0.5 - corner.y() + half),
                               fixed(stepU * scaleX), fixed(stepV * scaleY)};
+        const auto lineAt = [&](int x) {
+            return SampleLine{line.x + (x - from) * line.stepX, line.y + (x - from) * line.stepY, line.stepX,
+                              line.stepY};
+        };
         auto* row = reinterpret_cast<std::uint32_t*>(paper.image().scanLine(y));
-        if (solidFrom == from && solidTo == to) {
-            sampleLine(padded, line, row + from, to - from);
-            continue;
-        }
-        sampleLine(padded, line, samples.data(), to - from);
-        for (int x = from; x < to; ++x) {
-            const std::uint32_t sample = samples[static_cast<std::size_t>(x - from)];
-            if (x >= solidFrom && x < solidTo) {
-                row[x] = sample;
-                continue;
+        const auto edge = [&](int begin, int end) {
+            for (int x = begin; x < end; ++x) {
+                std::uint32_t sample = 0;
+                sampleLine(padded, lineAt(x), &sample, 1);
+                const double atU = startU + stepU * (x + 0.5);
+                const double atV = startV + stepV * (x + 0.5);
+                const double coverage = std::clamp(std::min(atU, zoomed.width - atU) + 0.5, 0.0, 1.0) *
+                                        std::clamp(std::min(atV, zoomed.height - atV) + 0.5, 0.0, 1.0);
+                row[x] = blended(row[x], sample, coverage);
             }
-            const double atU = startU + stepU * (x + 0.5);
-            const double atV = startV + stepV * (x + 0.5);
-            const double coverage = std::clamp(std::min(atU, zoomed.width - atU) + 0.5, 0.0, 1.0) *
-                                    std::clamp(std::min(atV, zoomed.height - atV) + 0.5, 0.0, 1.0);
-            row[x] = blended(row[x], sample, coverage);
-        }
+        };
+        edge(from, solidFrom);
+        sampleLine(padded, lineAt(solidFrom), row + solidFrom, solidTo - solidFrom);
+        edge(solidTo, to);
     }
+}
+
+// The tiles of a paper that are wanted, joined into larger rectangles where they stand side by side and then one above
+// the other.
+template <class Wanted>
+std::vector<QRect> joinedTiles(PictureSize paper, const Wanted& wanted) {
+    constexpr int tileWidth = 64;
+    constexpr int tileHeight = 32;
+    std::vector<QRect> done;
+    std::vector<QRect> open; // they reach down to the band
+    for (int top = 0; top < paper.height; top += tileHeight) {
+        const int height = std::min(tileHeight, paper.height - top);
+        std::vector<QRect> band;
+        for (int left = 0; left < paper.width; left += tileWidth) {
+            const QRect tile(left, top, std::min(tileWidth, paper.width - left), height);
+            if (!wanted(tile))
+                continue;
+            if (!band.empty() && band.back().right() + 1 == left)
+                band.back().setRight(tile.right());
+            else
+                band.push_back(tile);
+        }
+        for (const QRect& above : open) {
+            const auto below = std::find_if(band.begin(), band.end(), [&](const QRect& run) {
+                return run.left() == above.left() && run.right() == above.right();
+            });
+            if (below == band.end())
+                done.push_back(above);
+            else
+                below->setTop(above.top());
+        }
+        open = std::move(band);
+    }
+    done.insert(done.end(), open.begin(), open.end());
+    return done;
 }
 
 } // namespace
@@ -226,13 +260,13 @@ Placement::Point Placement::onPaper(double x, double y) const {
     return {panX + turn.cosine * across - turn.sine * down, panY + turn.sine * across + turn.cosine * down};
 }
 
-bool Placement::covers(PictureSize paper) const {
+bool Placement::covers(const QRect& part) const {
     const PictureSize size = zoomed();
     const Inverse inverse(*this, size);
     const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
     const double edge = level ? 0.0 : 0.5;
-    for (const double x : {0.5, paper.width - 0.5}) {
-        for (const double y : {0.5, paper.height - 0.5}) {
+    for (const double x : {part.left() + 0.5, part.left() + part.width() - 0.5}) {
+        for (const double y : {part.top() + 0.5, part.top() + part.height() - 0.5}) {
             const double u = inverse.u(x, y);
             const double v = inverse.v(x, y);
             if (u < edge || u > size.width - edge || v < edge || v > size.height - edge)
@@ -240,6 +274,10 @@ bool Placement::covers(PictureSize paper) const {
         }
     }
     return true;
+}
+
+std::vector<QRect> Placement::uncovered(PictureSize paper) const {
+    return joinedTiles(paper, [this](const QRect& tile) { return !covers(tile); });
 }
 
 PictureSize reducedSize(PictureSize source, const Placement& placement) {
@@ -279,21 +317,63 @@ void drawPlacedPart(Bitmap& paper, const Bitmap& pixels, const QRect& part, Pict
     drawSamples(paper, padded, part.topLeft(), reduced, placement);
 }
 
-Bitmap keyedFrame(const Bitmap& frame, PictureSize paper) {
+KeyedFrame keyedFrame(const Bitmap& frame, PictureSize paper) {
     QImage keyed = frame.image().convertToFormat(QImage::Format_ARGB32);
+    if (keyed.isNull() || paper.width < 1 || paper.height < 1 ||
+        !keyed.reinterpretAsFormat(QImage::Format_ARGB32_Premultiplied))
+        return {};
+    constexpr int solid = 24;
+    // Where something shows, in stretches of each row.
+    constexpr int stretch = 16;
+    const int stretches = (keyed.width() + stretch - 1) / stretch;
+    std::vector<std::uint8_t> shows(static_cast<std::size_t>(keyed.height()) * static_cast<std::size_t>(stretches));
     for (int y = 0; y < keyed.height(); ++y) {
         auto* row = reinterpret_cast<QRgb*>(keyed.scanLine(y));
+        auto* rowShows = shows.data() + std::ptrdiff_t{y} * stretches;
         for (int x = 0; x < keyed.width(); ++x) {
             const int sum = qRed(row[x]) + qGreen(row[x]) + qBlue(row[x]);
-            row[x] = (row[x] & 0x00FFFFFFU) | (static_cast<QRgb>(std::min(255, 11 * sum)) << 24);
+            if (sum == 0) {
+                row[x] = 0;
+                continue;
+            }
+            rowShows[x / stretch] = 1;
+            row[x] |= 0xFF000000U;
+            if (sum < solid)
+                row[x] = qPremultiply((row[x] & 0x00FFFFFFU) | (static_cast<QRgb>(11 * sum) << 24));
         }
     }
-    return resampled(Bitmap(keyed), paper);
+    // What the curve of the stretching reaches around a pixel of the paper, and a little more.
+    const double stepX = double(keyed.width()) / paper.width;
+    const double stepY = double(keyed.height()) / paper.height;
+    const auto reach = [](double step) { return 2 * std::max(1.0, step) + 1; };
+    const auto showsIn = [&](const QRect& tile) {
+        const int left = std::max(0, static_cast<int>(tile.left() * stepX - reach(stepX))) / stretch;
+        const int right = std::min(keyed.width() - 1, static_cast<int>((tile.right() + 1) * stepX + reach(stepX)));
+        const int top = std::max(0, static_cast<int>(tile.top() * stepY - reach(stepY)));
+        const int bottom = std::min(keyed.height() - 1, static_cast<int>((tile.bottom() + 1) * stepY + reach(stepY)));
+        for (int y = top; y <= bottom; ++y) {
+            const auto row = shows.begin() + std::ptrdiff_t{y} * stretches;
+            if (std::find(row + left, row + right / stretch + 1, 1) != row + right / stretch + 1)
+                return true;
+        }
+        return false;
+    };
+    KeyedFrame result;
+    for (const QRect& part : joinedTiles(paper, showsIn)) {
+        Bitmap pixels = resampledPart(Bitmap(keyed), paper, part);
+        if (pixels.isNull())
+            return {};
+        result.pieces.push_back({part.topLeft(), std::move(pixels)});
+    }
+    return result;
 }
 
-void drawKeyedFrame(Bitmap& paper, const Bitmap& keyed) {
-    if (!paper.isNull() && !keyed.isNull())
-        QPainter(&paper.image()).drawImage(0, 0, keyed.image());
+void drawKeyedFrame(Bitmap& paper, const KeyedFrame& keyed) {
+    if (paper.isNull() || keyed.pieces.empty())
+        return;
+    QPainter painter(&paper.image());
+    for (const KeyedFrame::Piece& piece : keyed.pieces)
+        painter.drawImage(piece.at, piece.pixels.image());
 }
 
 } // namespace lumora

@@ -4,6 +4,11 @@
 #include "imaging/ColourMatrix.h"
 #include "imaging/PictureFile.h"
 
+#include <QPoint>
+#include <QRect>
+
+#include <vector>
+
 namespace lumora {
 
 // Where a picture lands on the paper: zoomed and turned about the pan point, never mirrored. All in pixels of the
@@ -32,8 +37,12 @@ struct Placement {
     };
     Point onPaper(double x, double y) const;
 
-    // True when no pixel of a paper of this size is left uncovered.
-    bool covers(PictureSize paper) const;
+    // True when no pixel of a paper of this size, or of a part of one, is left uncovered.
+    bool covers(PictureSize paper) const { return covers(QRect(0, 0, paper.width, paper.height)); }
+    bool covers(const QRect& part) const;
+
+    // Rectangles that hold every pixel of the paper that is left uncovered, and few others. They do not overlap.
+    std::vector<QRect> uncovered(PictureSize paper) const;
 };
 
 // The size to which a larger source is best reduced before it is drawn at the zoomed size: a quarter more, so that the
@@ -55,11 +64,21 @@ QRect neededPart(PictureSize reduced, const Placement& placement, PictureSize pa
 void drawPlacedPart(Bitmap& paper, const Bitmap& pixels, const QRect& part, PictureSize reduced,
                     const Placement& placement);
 
-// A frame stretched to the size of the paper: alpha = min(255, 11 * (red + green + blue)), so that black is
-// transparent; the alpha is taken before the stretching, and colours are weighted by it. Null where memory is short.
-Bitmap keyedFrame(const Bitmap& frame, PictureSize paper);
+// A frame stretched to the size of a paper, without the parts that are wholly transparent: most frames have nothing in
+// their middle.
+struct KeyedFrame {
+    struct Piece {
+        QPoint at;
+        Bitmap pixels;
+    };
+    std::vector<Piece> pieces; // they do not overlap
+};
+
+// alpha = min(255, 11 * (red + green + blue)), so that black is transparent; the alpha is taken before the stretching,
+// and colours are weighted by it. Empty where memory is short.
+KeyedFrame keyedFrame(const Bitmap& frame, PictureSize paper);
 
 // Lays it over the whole paper.
-void drawKeyedFrame(Bitmap& paper, const Bitmap& keyed);
+void drawKeyedFrame(Bitmap& paper, const KeyedFrame& keyed);
 
 } // namespace lumora

@@ -16,6 +16,7 @@ struct PlaneAxis {
     int target = 0;
     double step = 1; // distance of two target samples in source samples
     int first = 0;   // where the first target sample stands; it and the last may lie beyond the source
+    bool operator==(const PlaneAxis&) const = default;
 };
 
 // Weights of an antialiased bicubic (a = -0.5, the kernel widened by the shrink): 14 fraction bits, and the weights of
@@ -52,9 +53,18 @@ private:
 // Scales one plane of bytes while its rows come in from the top; holds only the rows that are still needed.
 class PlaneScaler {
 public:
-    // rowsAtOnce: how many rows the giver writes before it calls rowsReady. rowBytes: how far it writes in a row.
+    // rowsAtOnce: how many rows the giver writes before it calls rowsReady. rowBytes: how far it writes in a row. like:
+    // another plane of the picture; where its axes are the same its weights serve this one too.
     PlaneScaler(PlaneAxis across, PlaneAxis down, int rowsAtOnce, int rowBytes,
-                const ResampleKernels& kernels = bestKernels());
+                const ResampleKernels& kernels = bestKernels(), const PlaneScaler* like = nullptr);
+
+    // The source that carries weight: only these rows and columns have to be written.
+    struct Range {
+        int begin;
+        int end;
+    };
+    Range inputRows() const;
+    Range inputColumns() const { return {m_weights->columnBegin, m_weights->columnBegin + m_weights->columnCount}; }
 
     // Where row y is to be written; y may pass the end of the picture by padding.
     std::uint8_t* inputRow(int y) { return m_input.data() + (y % m_inputRows) * m_inputStride; }
@@ -69,19 +79,25 @@ public:
     void release(int y);
 
 private:
+    // In the order that the kernels want.
+    struct Weights {
+        PlaneAxis across;
+        PlaneAxis down;
+        CubicWeights rows;
+        int columnBegin = 0; // the source columns that carry weight
+        int columnCount = 0;
+        std::vector<std::int32_t> firstPair;
+        std::vector<std::int16_t> pairWeights;
+        int pairs = 0;
+
+        Weights(const PlaneAxis& across, const PlaneAxis& down, int outputCount);
+    };
     void finishBlock(int rows);
 
     const ResampleKernels& m_kernels;
-    PlaneAxis m_across;
     PlaneAxis m_down;
-
-    CubicWeights m_rowWeights;
-    int m_columnBegin = 0; // the source columns that carry weight
-    int m_columnCount = 0;
-    std::vector<std::int32_t> m_firstPair;
-    std::vector<std::int16_t> m_pairWeights;
-    int m_pairs = 0;
     int m_outputCount = 0; // target samples of a row, rounded up to 8
+    std::shared_ptr<const Weights> m_weights;
 
     int m_inputRows = 0;
     std::ptrdiff_t m_inputStride = 0;

@@ -43,7 +43,8 @@ public:
                                    stepOf(plane.pitchX, m_source.width, m_target.width, pitch), m_part.left()};
             const PlaneAxis down{plane.height, (m_part.height() + pitch - 1) / pitch,
                                  stepOf(plane.pitchY, m_source.height, m_target.height, pitch), m_part.top()};
-            m_scalers.emplace_back(across, down, plane.rowsAtOnce, plane.rowBytes, m_kernels);
+            const PlaneScaler* like = m_scalers.empty() ? nullptr : &m_scalers.back();
+            m_scalers.emplace_back(across, down, plane.rowsAtOnce, plane.rowBytes, m_kernels, like);
         }
     }
     unsigned char* row(int plane, int y) override { return m_scalers[static_cast<std::size_t>(plane)].inputRow(y); }
@@ -153,6 +154,42 @@ private:
 
 } // namespace
 
+namespace {
+
+// source and target are of the same format, 32 bits; size is the whole picture's, part goes to target's corner at.
+void resampleInto(QImage& target, QPoint at, const QImage& source, PictureSize size, const QRect& part,
+                  const ResampleKernels& kernels) {
+    const PlaneAxis across{source.width(), part.width(), stepOf(1, source.width(), size.width, 1), part.left()};
+    const PlaneAxis down{source.height(), part.height(), stepOf(1, source.height(), size.height, 1), part.top()};
+    const int channels = source.hasAlphaChannel() ? 4 : 3;
+    std::vector<PlaneScaler> scalers;
+    scalers.reserve(4);
+    for (int i = 0; i < channels; ++i)
+        scalers.emplace_back(across, down, 1, source.width(), kernels, i > 0 ? &scalers.front() : nullptr);
+    const PlaneScaler::Range columns = scalers[0].inputColumns();
+    const PlaneScaler::Range lines = scalers[0].inputRows();
+    int next = 0;
+    std::vector<std::uint8_t*> rows(scalers.size());
+    for (int y = lines.begin; y < lines.end; ++y) {
+        for (std::size_t i = 0; i < rows.size(); ++i)
+            rows[i] = scalers[i].inputRow(y) + columns.begin;
+        splitRow(reinterpret_cast<const std::uint32_t*>(source.constScanLine(y)) + columns.begin,
+                 columns.end - columns.begin, rows);
+        for (PlaneScaler& scaler : scalers)
+            scaler.rowsReady(y + 1);
+        for (; next < scalers[0].outputEnd(); ++next) {
+            for (std::size_t i = 0; i < rows.size(); ++i)
+                rows[i] = scalers[i].outputRow(next);
+            // The curve overshoots at edges, so that a colour may come out above its alpha.
+            joinRow(rows, part.width(), reinterpret_cast<std::uint32_t*>(target.scanLine(at.y() + next)) + at.x());
+        }
+        for (PlaneScaler& scaler : scalers)
+            scaler.release(next);
+    }
+}
+
+} // namespace
+
 Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels) {
     return resampledPart(picture, size, wholeOf(size), kernels);
 }
@@ -166,32 +203,17 @@ Bitmap resampledPart(const Bitmap& picture, PictureSize size, const QRect& part,
     QImage target(part.size(), source.format());
     if (source.isNull() || target.isNull())
         return {};
-
-    const PlaneAxis across{source.width(), part.width(), stepOf(1, source.width(), size.width, 1), part.left()};
-    const PlaneAxis down{source.height(), part.height(), stepOf(1, source.height(), size.height, 1), part.top()};
-    const int channels = transparent ? 4 : 3;
-    std::vector<PlaneScaler> scalers;
-    scalers.reserve(4);
-    for (int i = 0; i < channels; ++i)
-        scalers.emplace_back(across, down, 1, source.width(), kernels);
-    int next = 0;
-    std::vector<std::uint8_t*> rows(scalers.size());
-    for (int y = 0; y < down.source; ++y) {
-        for (std::size_t i = 0; i < rows.size(); ++i)
-            rows[i] = scalers[i].inputRow(y);
-        splitRow(reinterpret_cast<const std::uint32_t*>(source.constScanLine(y)), across.source, rows);
-        for (PlaneScaler& scaler : scalers)
-            scaler.rowsReady(y + 1);
-        for (; next < scalers[0].outputEnd(); ++next) {
-            for (std::size_t i = 0; i < rows.size(); ++i)
-                rows[i] = scalers[i].outputRow(next);
-            // The curve overshoots at edges, so that a colour may come out above its alpha.
-            joinRow(rows, part.width(), reinterpret_cast<std::uint32_t*>(target.scanLine(next)));
-        }
-        for (PlaneScaler& scaler : scalers)
-            scaler.release(next);
-    }
+    resampleInto(target, {0, 0}, source, size, part, kernels);
     return Bitmap(std::move(target));
+}
+
+void drawStretched(Bitmap& paper, const Bitmap& picture, const QRect& part) {
+    const QRect area = part & QRect(0, 0, paper.width(), paper.height());
+    if (paper.isNull() || picture.isNull() || area.isEmpty())
+        return;
+    const QImage source = picture.image().convertToFormat(QImage::Format_RGB32);
+    if (!source.isNull())
+        resampleInto(paper.image(), area.topLeft(), source, {paper.width(), paper.height()}, area, bestKernels());
 }
 
 int decodeDenominator(PictureSize source, PictureSize wanted) {

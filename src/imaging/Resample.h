@@ -20,6 +20,10 @@ Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels&
 Bitmap resampledPart(const Bitmap& picture, PictureSize size, const QRect& part,
                      const ResampleKernels& kernels = bestKernels());
 
+// A part of the paper, which is 32 bits without alpha, under the picture stretched over the whole of it. The picture
+// has no alpha either.
+void drawStretched(Bitmap& paper, const Bitmap& picture, const QRect& part);
+
 // The strongest scaled decode (1, 2, 4 or 8) that still leaves at least twice the pixels wanted: nearer than that,
 // quality suffers.
 int decodeDenominator(PictureSize source, PictureSize wanted);

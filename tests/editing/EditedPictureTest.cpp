@@ -11,6 +11,7 @@
 
 #include <cmath>
 #include <cstdlib>
+#include <functional>
 
 namespace lumora {
 namespace {
@@ -254,6 +255,42 @@ TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
     caption.family = QStringLiteral("David");
     drawInk(paper, inkOf(caption, {200, 60}));
     EXPECT_FALSE(darkBox(paper).isNull());
+}
+
+TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
+    CaptionInks inks;
+    PictureCaption caption;
+    caption.text = QStringLiteral("שלום Lumora\r\n2024");
+    caption.family = QStringLiteral("DejaVu Sans");
+    caption.emSize = 24;
+    PaperScale scale;
+    const std::function<void()> steps[] = {
+        [&] { caption.x = 40; },
+        [&] { caption.x = -30; },
+        [&] { caption.y = 190; },
+        [&] { caption.emSize = 31; },
+        [&] { caption.align = PictureCaption::Align::Centre; },
+        [&] {
+            scale = {1.5, 1.5};
+        },
+        [&] { caption.x = 51; },
+        [&] { caption.run = PictureCaption::Run::Down; },
+        [&] { caption.colour = Qt::red; },
+        [&] { caption.bold = true; },
+        [&] { caption.emSize = 99; }, // larger than the paper: no longer kept
+        [&] { caption.x = 60; },
+        [&] { caption.text = QStringLiteral("A"); },
+        [&] { caption.family = QStringLiteral("No Such Family"); },
+        [&] { caption.family = QStringLiteral("DejaVu Sans"); },
+    };
+    for (std::size_t i = 0; i < std::size(steps); ++i) {
+        steps[i]();
+        Bitmap kept(300, 200, Qt::white);
+        Bitmap fresh = kept;
+        drawInk(kept, inks.inkOf(caption, {300, 200}, scale));
+        drawInk(fresh, inkOf(caption, {300, 200}, scale));
+        EXPECT_EQ(kept.image(), fresh.image()) << "step " << i;
+    }
 }
 
 } // namespace

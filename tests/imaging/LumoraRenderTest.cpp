@@ -74,6 +74,79 @@ TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
     EXPECT_FALSE(QFileInfo::exists(at("out/broken.jpg")));
 }
 
+// Each record prints the picture without the edit that its fault spoils: like another record, or like none.
+TEST_F(LumoraRenderTest, aRecordWithAFaultGivesThePictureWithoutThatEdit) {
+    const auto record = [](const char* rotation, const char* panX, const char* frame, const char* folder) {
+        return QStringLiteral("1   1   1   %1100%2150 0  0  %3000      %4")
+            .arg(QString::fromLatin1(rotation), -3)
+            .arg(QString::fromLatin1(panX), -4)
+            .arg(QString::fromLatin1(frame), -3)
+            .arg(QString::fromLatin1(folder), -10);
+    };
+    ASSERT_TRUE(QDir(m_folder.path()).mkpath(QStringLiteral("frames/aa")));
+    QImage black(15, 10, QImage::Format_RGB32);
+    black.fill(qRgb(30, 30, 30));
+    for (const char* name : {"frames/aa/001.bmp", "frames/aa/k001.bmp", "001.bmp", "k001.bmp"})
+        ASSERT_TRUE(black.save(at(name)));
+    ASSERT_TRUE(writeWholeFile(at("frames/aa/002.bmp").toStdString(), "no bitmap"));
+    ASSERT_TRUE(writeWholeFile(at("frames/aa/k002.bmp").toStdString(), "no bitmap"));
+
+    const auto shown = [&](const char* mode, const QString& text) {
+        EXPECT_EQ(run({QString::fromLatin1(mode), "--paper", "10/15", "--png", "--record", text, "--frames", "frames",
+                       "--out", "out", "a b.jpg"}),
+                  0)
+            << qPrintable(text) << ": " << qPrintable(m_err);
+        return QImage(at("out/a b.png"));
+    };
+    const QString bare = record("180", "225", "000", "");
+    struct Case {
+        const char* what;
+        QString faulty;
+        QString like;
+        const char* mode = "print";
+    };
+    const Case cases[] = {
+        {"letters behind a number", record("19x", "2x", "000", ""), record("19", "2", "000", "")},
+        {"letters for a number", record("x80", "225", "000", ""), record("0", "225", "000", "")},
+        {"999 in one axis", record("180", "999", "000", ""), bare, "preview"},
+        {"no such frame", record("180", "225", "777", "aa"), bare},
+        {"a frame that is no bitmap", record("180", "225", "002", "aa"), bare},
+        {"a folder with ..", record("180", "225", "001", "aa/.."), bare},
+        {"a folder above", record("180", "225", "001", ".."), bare},
+        {"a folder with a backslash", record("180", "225", "001", "aa\\..\\.."), bare},
+        {"an absolute folder", record("180", "225", "001", "/tmp"), bare},
+        {"a frame with ..", record("180", "225", "../", "aa"), bare},
+    };
+    for (const Case& fault : cases)
+        EXPECT_EQ(shown(fault.mode, fault.faulty), shown(fault.mode, fault.like)) << fault.what;
+    EXPECT_NE(shown("print", record("180", "225", "001", "aa")), shown("print", bare)) << "the frame itself shows";
+}
+
+TEST_F(LumoraRenderTest, eachFaultOfACallHasItsStatusAndItsMessage) {
+    struct Case {
+        QStringList call;
+        int status;
+        const char* message;
+    };
+    const QString record = QStringLiteral("1   1   1   180100225 150 0  0  000");
+    const Case cases[] = {
+        {{"print", "--paper", "10/15", "--record", record, "--out", "out", "gone.jpg"}, 1, "gone.jpg"},
+        {{"preview", "--paper", "10/15", "--record", record, "--out", "out", "broken.jpg"}, 1, "broken.jpg"},
+        {{"print", "--paper", "zz/zz", "--out", "out", "a b.jpg"}, 2, "--paper zz/zz is no paper size"},
+        {{"print", "--paper", "0/15", "--out", "out", "a b.jpg"}, 2, "--paper 0/15 is no paper size"},
+        {{"print", "--paper", "***", "--out", "out", "a b.jpg"}, 2, "--paper *** is no paper size"},
+        {{"print", "--paper", "10/15", "--background", "12345", "--out", "out", "a b.jpg"}, 2, "is no colour"},
+        {{"print", "--paper", "10/15", "--background", "12345G", "--out", "out", "a b.jpg"}, 2, "is no colour"},
+        {{"print", "--paper", "10/15", "--frames", "gone", "--out", "out", "a b.jpg"}, 2, "--frames gone is no folder"},
+    };
+    for (const Case& fault : cases) {
+        EXPECT_EQ(run(fault.call), fault.status) << qPrintable(fault.call.join(u' '));
+        EXPECT_TRUE(m_err.startsWith(QStringLiteral("lumora-render: "))) << qPrintable(m_err);
+        EXPECT_TRUE(m_err.contains(QString::fromLatin1(fault.message))) << qPrintable(m_err);
+    }
+    EXPECT_TRUE(QDir(at("out")).isEmpty());
+}
+
 TEST_F(LumoraRenderTest, aCallThatCanNotBeUnderstoodDoesNothing) {
     const QByteArray before = *encodeJpeg(*loadPicture(at("a b.jpg").toStdString()), 90);
     for (const QStringList& call :

@@ -1,5 +1,9 @@
 #include "imaging/PlacedDraw.h"
 
+#include "imaging/Resample.h"
+
+#include <QPainter>
+
 #include <gtest/gtest.h>
 
 #include <array>
@@ -160,6 +164,45 @@ TEST(KeyedFrame, MakesBlackTransparentAndDarkPartlySo) {
         EXPECT_NEAR(qGreen(found), expected.out[1], 1);
         EXPECT_NEAR(qBlue(found), expected.out[2], 1);
     }
+}
+
+// A tile of the key or of the background that is wrongly taken for empty would leave a hole.
+TEST(KeyedFrame, InPiecesIsTheWholeFrame) {
+    Bitmap frame(90, 61, Qt::black);
+    for (const QPoint& point : {QPoint(0, 0), QPoint(42, 30), QPoint(89, 60), QPoint(60, 3)})
+        frame.image().setPixel(point, 0xFF0C64FA);
+    frame.image().setPixel(20, 50, 0xFF020301);
+    QImage alpha = frame.image().convertToFormat(QImage::Format_ARGB32);
+    for (int y = 0; y < alpha.height(); ++y) {
+        for (int x = 0; x < alpha.width(); ++x) {
+            const QRgb pixel = alpha.pixel(x, y);
+            const int key = std::min(255, 11 * (qRed(pixel) + qGreen(pixel) + qBlue(pixel)));
+            alpha.setPixel(x, y, qRgba(qRed(pixel), qGreen(pixel), qBlue(pixel), key));
+        }
+    }
+    for (const PictureSize size : {PictureSize{1500, 1000}, PictureSize{450, 300}, PictureSize{40, 27}}) {
+        Bitmap pieces(size.width, size.height, QColor(200, 150, 100));
+        Bitmap whole = pieces;
+        drawKeyedFrame(pieces, keyedFrame(frame, size));
+        QPainter(&whole.image()).drawImage(0, 0, resampled(Bitmap(alpha), size).image());
+        EXPECT_EQ(pieces.image(), whole.image()) << size.width;
+    }
+}
+
+TEST(Placement, UncoveredPartsHoldEveryPixelThatIsBare) {
+    constexpr PictureSize paper{1500, 1000};
+    Bitmap source(300, 225, Qt::red);
+    for (const Placement& placement :
+         {placed(1500, 1125, 100, 187, 750, 500), placed(1500, 1125, 40, 180, 750, 500),
+          placed(1500, 1125, 210, 200, 0, 0), placed(1500, 1125, 100, 180, 999 * 3, 999 * 3)}) {
+        Bitmap stretched(paper.width, paper.height, Qt::white);
+        for (const QRect& part : placement.uncovered(paper))
+            drawStretched(stretched, source, part);
+        drawPlaced(stretched, source, placement, ColourMatrix());
+        Bitmap red(paper.width, paper.height, Qt::red);
+        EXPECT_EQ(stretched.image(), red.image()) << placement.zoomPercent << ' ' << placement.rotationCode;
+    }
+    EXPECT_TRUE(placed(1500, 1125, 100, 180, 750, 500).uncovered(paper).empty());
 }
 
 } // namespace

@@ -5,6 +5,7 @@
 #include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
 #include "imaging/PictureFile.h"
+#include "imaging/PictureMemory.h"
 #include "session/SessionState.h"
 
 #include <QBuffer>
@@ -257,6 +258,7 @@ Result<void> render(const Request& request, const fs::path& source, const fs::pa
 } // namespace
 
 int main(int argc, char** argv) {
+    keepPictureMemory();
     const std::vector<std::string> arguments(argv + 1, argv + argc);
     for (const std::string& argument : arguments) {
         if (argument == "--help" || argument == "--version") {

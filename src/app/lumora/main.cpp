@@ -1,4 +1,5 @@
 #include "app/Program.h"
+#include "imaging/PictureMemory.h"
 #include "views/Application.h"
 #include "views/StartFailure.h"
 
@@ -11,6 +12,7 @@
 using namespace lumora;
 
 int main(int argc, char** argv) {
+    keepPictureMemory();
     // Help needs no screen.
     const auto asksForHelp = [](const char* word) {
         return QByteArrayList{"-h", "--help", "-v", "--version"}.contains(QByteArray(word));

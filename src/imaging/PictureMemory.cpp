@@ -1,0 +1,18 @@
+#include "imaging/PictureMemory.h"
+
+#include <cstdlib>
+
+#ifdef __GLIBC__
+#include <malloc.h>
+#endif
+
+namespace lumora {
+
+void keepPictureMemory() {
+#ifdef __GLIBC__
+    mallopt(M_MMAP_THRESHOLD, 32 << 20);
+    mallopt(M_TRIM_THRESHOLD, 64 << 20);
+#endif
+}
+
+} // namespace lumora
