@@ -4,13 +4,15 @@
 #include <cstdio>
 #include <cstdlib>
 
-// photographs FOLDER COUNT: all of them landscape, so that one box means the same print to every peer.
+// photographs FOLDER COUNT [WIDTH HEIGHT]: 4000 x 3000 if no size is given; all of them landscape, so that one box
+// means the same print to every peer.
 int main(int argc, char** argv) {
-    if (argc != 3)
+    if (argc != 3 && argc != 5)
         return 2;
+    const lumora::PictureSize size{argc == 5 ? std::atoi(argv[3]) : 4000, argc == 5 ? std::atoi(argv[4]) : 3000};
     for (int i = 1; i <= std::atoi(argv[2]); ++i) {
         const std::filesystem::path path = std::filesystem::path(argv[1]) / ("IMG_" + std::to_string(100 + i) + ".jpg");
-        const auto bytes = lumora::samplePhotographFile({4000, 3000}, static_cast<unsigned>(i));
+        const auto bytes = lumora::samplePhotographFile(size, static_cast<unsigned>(i));
         if (const auto written = lumora::writeWholeFile(path, bytes); !written) {
             std::fprintf(stderr, "%s\n", qPrintable(written.failure().message));
             return 1;

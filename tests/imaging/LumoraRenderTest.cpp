@@ -77,11 +77,10 @@ TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
 // Each record prints the picture without the edit that its fault spoils: like another record, or like none.
 TEST_F(LumoraRenderTest, aRecordWithAFaultGivesThePictureWithoutThatEdit) {
     const auto record = [](const char* rotation, const char* panX, const char* frame, const char* folder) {
-        return QStringLiteral("1   1   1   %1100%2150 0  0  %3000      %4")
-            .arg(QString::fromLatin1(rotation), -3)
-            .arg(QString::fromLatin1(panX), -4)
-            .arg(QString::fromLatin1(frame), -3)
-            .arg(QString::fromLatin1(folder), -10);
+        const auto field = [](const char* text, int width) { return QString::fromLatin1(text).leftJustified(width); };
+        return QStringLiteral("1   1   1   ") + field(rotation, 3) + field("100", 3) + field(panX, 4) +
+               field("150", 4) + field("0", 3) + field("0", 3) + field(frame, 3) + QStringLiteral("000      ") +
+               field(folder, 10);
     };
     ASSERT_TRUE(QDir(m_folder.path()).mkpath(QStringLiteral("frames/aa")));
     QImage black(15, 10, QImage::Format_RGB32);
