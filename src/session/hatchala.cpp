@@ -251,10 +251,9 @@ void hatchala::MouseMove(Hover over) {
 
 void hatchala::Timer1_Tick() {
     Timer1.stop();
-    if (!Workspace(m_state, m_platform.files).MakeRootFolders())
-        return;
-    // A picture that does not come is no loss: the page stays as it is.
-    if (const auto target = m_platform.files.drives().toHost(m_state.profile.AdFile1))
+    // A picture that does not come is no loss: one that is there already shows all the same.
+    const auto target = m_platform.files.drives().toHost(m_state.profile.AdFile1);
+    if (target && Workspace(m_state, m_platform.files).MakeRootFolders())
         (void)m_platform.internet.download(m_state.profile.AdUrl1, *target);
     if (m_platform.files.fileExists(m_state.profile.AdFile1)) {
         Picture4 = m_state.profile.AdFile1;

@@ -210,6 +210,19 @@ TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
     EXPECT_EQ(page.Picture4Width, 5);
 }
 
+TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade) {
+    hatchala& page = start();
+    site.answer = "picture";
+    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora"), "a file in the way").ok());
+    page.Timer1_Tick();
+    EXPECT_EQ(page.Picture4, QString());
+    std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
+    ASSERT_TRUE(machine.files.writeWhole(state.profile.AdFile1, "picture").ok());
+    page.Timer1_Tick();
+    EXPECT_EQ(page.Picture4, state.profile.AdFile1);
+    EXPECT_EQ(site.urls, QStringList()) << "nothing is fetched then";
+}
+
 TEST_F(hatchalaTest, ThePageThatWaitsAsksForNoRendering) {
     hatchala& page = start();
     int renderings = 0;
