@@ -142,9 +142,8 @@ void FtpFrm::Command1_Click() {
     Label7.text = QString::number(List3.count());
     const QString& folder = m_state.transfer.OrderFolder;
     m_state.transfer.HazmanaP = m_state.transfer.ShemTikiya.endsWith(u'P') ? 1 : 0;
-    ClearReadDetails(m_state.shemot);
-    ReadOrderDetails(m_platform.files, JoinDrivePath(folder, m_state.transfer.ShemTikiya + QStringLiteral(".txt")),
-                     m_state.shemot);
+    ReadResentDetails(m_platform.files, JoinDrivePath(folder, m_state.transfer.ShemTikiya + QStringLiteral(".txt")),
+                      m_state.shemot);
     ShowOrderSummary();
     addProofPicture();
     for (const QString& path : ReadBrokenFiles(m_platform.files, folder)) {

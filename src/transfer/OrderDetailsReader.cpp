@@ -45,35 +45,45 @@ void setAll(OrderDetails& details, const QString& text) {
     details.TotalPics = 0;
 }
 
-} // namespace
-
-void ClearReadDetails(OrderDetails& details) {
-    setAll(details, {});
+template <std::size_t N>
+void take(const std::array<Field, N>& fields, const ListOutputEntry& entry, OrderDetails& details) {
+    for (const auto& [key, field] : fields) {
+        if (entry.key == key)
+            details.*field = entry.value;
+    }
 }
 
+Result<QByteArray> logBytes(const Files& files, const QString& path) {
+    return files.fileExists(path) ? files.read(path) : Result<QByteArray>(Failure{Failure::Kind::NotFound, path});
+}
+
+} // namespace
+
 void ReadOrderDetails(const Files& files, const QString& path, OrderDetails& details) {
-    const auto bytes =
-        files.fileExists(path) ? files.read(path) : Result<QByteArray>(Failure{Failure::Kind::NotFound, path});
+    const auto bytes = logBytes(files, path);
     if (!bytes) {
         setAll(details, QStringLiteral("NO details"));
         return;
     }
     for (const ListOutputEntry& entry : ReadListOutput(*bytes)) {
-        if (entry.key == QStringLiteral("Shemot.TotalPics")) {
+        if (entry.key == QStringLiteral("Shemot.TotalPics"))
             details.TotalPics = Val16(entry.value);
-            continue;
-        }
-        for (const auto& [key, field] : textFields()) {
-            if (entry.key == key)
-                details.*field = entry.value;
-        }
-        // What the session knows of a new album is more than its log tells: only gaps are filled.
-        for (const auto& [key, field] : albumFields()) {
-            if (entry.key == key && (details.*field).isEmpty())
-                details.*field = entry.value;
-        }
-        if (entry.key == QStringLiteral("TotalPics") && details.TotalPics == 0)
+        else
+            take(textFields(), entry, details);
+    }
+}
+
+void ReadResentDetails(const Files& files, const QString& path, OrderDetails& details) {
+    setAll(details, {});
+    ReadOrderDetails(files, path, details);
+    const auto bytes = logBytes(files, path);
+    if (!bytes)
+        return;
+    for (const ListOutputEntry& entry : ReadListOutput(*bytes)) {
+        if (entry.key == QStringLiteral("TotalPics"))
             details.TotalPics = Val16(entry.value);
+        else
+            take(albumFields(), entry, details);
     }
 }
 

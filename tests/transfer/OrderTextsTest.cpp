@@ -86,20 +86,24 @@ TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
     EXPECT_EQ(details.TotalPics, 13);
 }
 
-TEST(ReadOrderDetails, FillsTheGapsFromTheLogOfAnAlbum) {
+TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAgain) {
     TestPlatform test;
     const QString path = QStringLiteral("C:\\log.txt");
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
                                       "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
-    OrderDetails details; // as a resend clears it
+    OrderDetails details; // a new album has no customer, and the address may have been mended since
+    details.Mail = QStringLiteral("as corrected@example.com");
+    details.Bord = QStringLiteral("NB");
     ReadOrderDetails(test.files, path, details);
+    EXPECT_EQ(details.n1, QString());
+    EXPECT_EQ(details.Mail, QStringLiteral("as corrected@example.com"));
+    EXPECT_EQ(details.TotalPics, 0);
+    ReadResentDetails(test.files, path, details);
     EXPECT_EQ(details.n1, QStringLiteral("Studio Or"));
     EXPECT_EQ(details.ppr, QStringLiteral("30/60"));
     EXPECT_EQ(details.Mail, QStringLiteral("studio@example.com"));
+    EXPECT_EQ(details.Bord, QString()) << "of another order";
     EXPECT_EQ(details.TotalPics, 14);
-    details.Mail = QStringLiteral("as corrected@example.com");
-    ReadOrderDetails(test.files, path, details);
-    EXPECT_EQ(details.Mail, QStringLiteral("as corrected@example.com"));
 }
 
 TEST(ReadOrderDetails, SaysSoWhenThereIsNoLog) {
