@@ -3,7 +3,6 @@
 #include "assembly/OrderFolder.h"
 #include "assembly/OrderItem.h"
 #include "assembly/OrderLog.h"
-#include "assembly/OrderSheet.h"
 #include "assembly/PaperResize.h"
 #include "assembly/WorkAhead.h"
 #include "common/DrivePathText.h"
@@ -172,7 +171,7 @@ void Form2::Command4_Click() {
         return;
     setPreparing(true);
     CountTotalPics();
-    const bool goOn = drawSheet(true);
+    const bool goOn = drawSheet(SheetKind::Album);
     setPreparing(false);
     if (goOn)
         setStage(Stage::Waiting);
@@ -182,7 +181,7 @@ void Form2::Command5_Click() {
     if (preparing)
         return;
     setPreparing(true);
-    const bool goOn = drawSheet(m_state.Optint == 10);
+    const bool goOn = drawSheet(sheetKind());
     setPreparing(false);
     if (goOn)
         setStage(Stage::Waiting);
@@ -232,7 +231,7 @@ bool Form2::prepareOrder() {
     // Before the sheet is drawn: it shows the number.
     claimOrderNumber(m_state, m_platform.files, OrderFolder::Ending::BySession);
     CountTotalPics();
-    if (!drawSheet(m_state.Optint == 10))
+    if (!drawSheet(sheetKind()))
         return false;
 
     const OrderFolder folder(m_state, OrderFolder::Ending::BySession);
@@ -272,11 +271,14 @@ void Form2::PackOnePicture(int index, PrintPacker& packer, Prints& prints) {
     });
 }
 
-bool Form2::drawSheet(bool album) {
-    const SheetKind kind = album ? SheetKind::Album : SheetKind::Plain;
+SheetKind Form2::sheetKind() const {
+    return m_state.Optint == 10 ? SheetKind::Album : SheetKind::Plain;
+}
+
+bool Form2::drawSheet(SheetKind kind) {
     OrderSheet sheet(kind, orderSheetSize(kind, List1.count()), orderSheetBackground(kind, m_state));
     const QDateTime now = m_platform.clock.now();
-    sheet.drawLines(album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now));
+    sheet.drawLines(kind == SheetKind::Album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now));
     std::vector<SheetCell> cells;
     for (const QString& item : List1.items())
         cells.push_back({m_platform.files.drives().toHost(split(item).path),

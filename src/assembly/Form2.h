@@ -1,5 +1,6 @@
 #pragma once
 
+#include "assembly/OrderSheet.h"
 #include "assembly/PreparationPage.h"
 
 #include <QPoint>
@@ -48,7 +49,8 @@ private:
     void KeepOnlyJpeg();
     void setPreparing(bool on) override;
     void showProgress() override;
-    bool drawSheet(bool album);
+    SheetKind sheetKind() const; // of the order, album or prints
+    bool drawSheet(SheetKind kind);
     bool prepareOrder();
     void PackOnePicture(int index, PrintPacker& packer, Prints& prints);
 

@@ -102,8 +102,8 @@ public:
     void amok4_Click();
     void amok5_Click();
     void amok_Click();
-    void Memokad_Click();
-    void Rstor_Click(); // back to the customer's picture
+    void Memokad_Click(); // only closes the menu
+    void Rstor_Click();   // back to the customer's picture
 
     // Events: the instructions, all at once
     void CommandHelp_Click();
@@ -221,8 +221,7 @@ private:
     DragHandle m_drag;
     QPointF m_pressed; // where the drag began
     bool m_dragged = false;
-    bool m_ticked = false;  // since a button was held down
-    bool m_focused = false; // Memokad; nothing reads it
+    bool m_ticked = false; // since a button was held down
     Step m_step = Step::FindEye;
 };
 

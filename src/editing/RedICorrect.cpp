@@ -347,7 +347,6 @@ void RedI::amok5_Click() {
 
 void RedI::Memokad_Click() {
     kofez_Close();
-    m_focused = true;
 }
 
 // For the operator

@@ -136,7 +136,6 @@ public:
 
     Caption Title;  // what to do on this page
     Caption Frame1; // the frame of the cells; text: what to do while there are none
-    int frame1Width() const { return 3 * cellSize + 39; }
     LargeView Picture2;
     Caption Label1; // the path of the picture in hand, or the number of lines after Command11
     Caption Label2; // the path that Image4 turns

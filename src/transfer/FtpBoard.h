@@ -56,7 +56,6 @@ struct FtpBoard {
     int PicInProgKatanWidth = 0; // pieces of one order, 0 to Pic4ProgWidth
     Caption Label4Diff;          // estimated minutes left; only when the order travels as pieces
     Caption Label4DiffTitle;
-    static constexpr int Picture1FullWidth = 266;
     Caption Picture1;      // the bar that runs in each pause
     int Picture1Width = 0; // 0 to Picture1FullWidth
     Caption Label34;       // which attempt

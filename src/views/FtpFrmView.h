@@ -33,7 +33,6 @@ private:
     Gauge* m_gauge = nullptr;
     QFrame* m_failure = nullptr;
     QLabel* m_failureLine = nullptr;
-    QFrame* m_success = nullptr;
     QLabel* m_successLine = nullptr;
     QFrame* m_summary = nullptr;
     QLabel* m_summaryLines = nullptr;

@@ -1,7 +1,6 @@
-#include "Walk.h"
+#include "PageLook.h"
 
 #include "editing/mikledet.h"
-#include "editing/tFrmNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "views/MainWindow.h"
@@ -18,32 +17,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-struct Screen {
-    QSize size;
-    bool english;
-};
-
-void PrintTo(const Screen& screen, std::ostream* out) {
-    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
-}
-
-void offerEditor(Walk& walk) {
-    Program& program = walk.program();
-    if (!program.chain().isRegistered(PageId::tFrmNew))
-        program.chain().registerPage(PageId::tFrmNew, [&program] {
-            return std::make_unique<tFrmNew>(program.state(), program.platform(), program.chain());
-        });
-}
-
-class CaptionKeyboard : public ::testing::TestWithParam<Screen> {
-protected:
-    void look(Walk& walk, const QString& name) {
-        walk.settle(60);
-        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
-        for (const QString& fault : walk.faults(GetParam().english))
-            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
-    }
-};
+class CaptionKeyboard : public PageLook {};
 
 } // namespace
 
@@ -53,7 +27,6 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
         walk.press(u"hatchala"_s, u"Check1"_s);
     PageChain& chain = walk.program().chain();
     SessionState& state = walk.program().state();
-    offerEditor(walk);
     state.edit.TextOn = 1;
     chain.show(PageId::mikledet);
     auto& page = walk.page<mikledet>(PageId::mikledet);
@@ -99,7 +72,6 @@ TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     Walk walk({1024, 768});
     SessionState& state = walk.program().state();
     PageChain& chain = walk.program().chain();
-    offerEditor(walk);
     state.edit.TextFontSize = 24;
     state.edit.TextOn = 1;
     chain.show(PageId::mikledet);
@@ -130,8 +102,6 @@ TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     EXPECT_EQ(chain.front()->id(), PageId::tFrmNew);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard,
-                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
-                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard, PageLook::screens());
 
 } // namespace lumora

@@ -1,4 +1,4 @@
-#include "Walk.h"
+#include "PageLook.h"
 
 #include "editing/tFrmNew.h"
 #include "selection/kyoskNew.h"
@@ -21,24 +21,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-struct Screen {
-    QSize size;
-    bool english;
-};
-
-void PrintTo(const Screen& screen, std::ostream* out) {
-    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
-}
-
-class EditorLook : public ::testing::TestWithParam<Screen> {
-protected:
-    void look(Walk& walk, const QString& name) {
-        walk.settle(80);
-        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
-        for (const QString& fault : walk.faults(GetParam().english))
-            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
-    }
-};
+class EditorLook : public PageLook {};
 
 } // namespace
 
@@ -187,8 +170,6 @@ TEST(EditorByKeyboard, ReachesEachToolAndLeavesByEsc) {
     walk.waitFor(u"kyoskNew"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, EditorLook,
-                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
-                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+INSTANTIATE_TEST_SUITE_P(Screens, EditorLook, PageLook::screens());
 
 } // namespace lumora

@@ -1,4 +1,4 @@
-#include "Walk.h"
+#include "PageLook.h"
 
 #include "editing/RedEye.h"
 #include "editing/RedI.h"
@@ -22,15 +22,6 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 namespace {
-
-struct Screen {
-    QSize size;
-    bool english;
-};
-
-void PrintTo(const Screen& screen, std::ostream* out) {
-    *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
-}
 
 constexpr PictureSize photograph{2400, 1800};
 constexpr QPoint eye{900, 700};
@@ -59,7 +50,7 @@ Bitmap flashPhotograph() {
     return picture;
 }
 
-class RedEyeView : public ::testing::TestWithParam<Screen> {
+class RedEyeView : public PageLook {
 protected:
     RedEyeView()
         : walk(GetParam().size) {
@@ -82,12 +73,7 @@ protected:
         ASSERT_TRUE(pressed.ok()) << qPrintable(pressed.failure().message);
         walk.settle();
     }
-    void look(const QString& name) {
-        walk.settle(60);
-        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en"_s : u"he"_s));
-        for (const QString& fault : walk.faults(GetParam().english))
-            ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
-    }
+    void look(const QString& name) { PageLook::look(walk, name); }
 
     Walk walk;
 };
@@ -210,9 +196,7 @@ TEST_P(RedEyeHands, GivesTheLabsOperatorTheBarAndTheReadings) {
     look(u"redi-8-operator"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView,
-                         ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true},
-                                           Screen{{1920, 1080}, false}, Screen{{1920, 1080}, true}));
+INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView, PageLook::screens());
 
 INSTANTIATE_TEST_SUITE_P(Screens, RedEyeHands, ::testing::Values(Screen{{1024, 768}, false}));
 
