@@ -87,6 +87,23 @@ void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers m
     QApplication::sendEvent(&widget, &release);
 }
 
+Result<const PageView::Control*> boundIn(const Result<PageView*>& view, const QString& page, const QString& control) {
+    if (!view)
+        return view.failure();
+    if (const PageView::Control* bound = (*view)->control(control))
+        return bound;
+    return fail(u"%1 has no control %2"_s.arg(page, control));
+}
+
+Result<const TextList*> listIn(const Result<PageView*>& view, const QString& page, const QString& control) {
+    if (!view)
+        return view.failure();
+    const PageView::Control* bound = (*view)->control(control);
+    if (bound && bound->list)
+        return bound->list;
+    return fail(u"%1 has no list %2"_s.arg(page, control));
+}
+
 // What really takes the press: a list or a text area does so by its viewport.
 QWidget& target(QWidget& widget) {
     auto* area = qobject_cast<QAbstractScrollArea*>(&widget);
@@ -278,61 +295,50 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
 }
 
 Result<QString> ControlFinder::text(const QString& page, const QString& control) const {
-    const Result<PageView*> found = view(page);
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
     if (!found)
         return found.failure();
-    if (const PageView::Control* bound = (*found)->control(control)) {
-        if (bound->text)
-            return bound->text();
-        if (bound->caption)
-            return bound->caption->text;
-        if (bound->list)
-            return bound->list->currentItem();
-    }
-    return fail(u"%1 has no control %2"_s.arg(page, control));
+    const PageView::Control& is = **found;
+    if (is.text)
+        return is.text();
+    if (is.caption)
+        return is.caption->text;
+    if (is.list)
+        return is.list->currentItem();
+    return fail(u"%1.%2 has no text"_s.arg(page, control));
 }
 
 Result<bool> ControlFinder::visible(const QString& page, const QString& control) const {
-    const Result<PageView*> found = view(page);
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control* bound = (*found)->control(control);
-    if (!bound)
-        return fail(u"%1 has no control %2"_s.arg(page, control));
-    return bound->widget && bound->widget->isVisible();
+    const QWidget* widget = (*found)->widget;
+    return widget && widget->isVisible();
 }
 
 Result<bool> ControlFinder::enabled(const QString& page, const QString& control) const {
-    const Result<PageView*> found = view(page);
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control* bound = (*found)->control(control);
-    if (!bound)
-        return fail(u"%1 has no control %2"_s.arg(page, control));
-    return bound->widget ? bound->widget->isEnabled() : bound->caption && bound->caption->enabled;
+    const PageView::Control& is = **found;
+    return is.widget ? is.widget->isEnabled() : is.caption && is.caption->enabled;
 }
 
 Result<int> ControlFinder::count(const QString& page, const QString& control) const {
-    const Result<PageView*> found = view(page);
+    const Result<const TextList*> found = listIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control* bound = (*found)->control(control);
-    if (!bound || !bound->list)
-        return fail(u"%1 has no list %2"_s.arg(page, control));
-    return bound->list->count();
+    return (*found)->count();
 }
 
 Result<QString> ControlFinder::item(const QString& page, const QString& control, int index) const {
-    const Result<PageView*> found = view(page);
+    const Result<const TextList*> found = listIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control* bound = (*found)->control(control);
-    if (!bound || !bound->list)
-        return fail(u"%1 has no list %2"_s.arg(page, control));
-    if (index < 0 || index >= bound->list->count())
-        return fail(
-            u"%1.%2 has %3 rows, none with the index %4"_s.arg(page, control).arg(bound->list->count()).arg(index));
-    return bound->list->item(index);
+    const int count = (*found)->count();
+    if (index < 0 || index >= count)
+        return fail(u"%1.%2 has %3 rows, none with the index %4"_s.arg(page, control).arg(count).arg(index));
+    return (*found)->item(index);
 }
 
 } // namespace lumora

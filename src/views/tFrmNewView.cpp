@@ -69,6 +69,14 @@ tFrmNewView::tFrmNewView(tFrmNew& page, PageChain& chain, const SessionState& st
 
 // --- makers ---
 
+QVBoxLayout* tFrmNewView::toolColumn(QWidget& box) const {
+    box.setFixedWidth(theme().px(columnWidth));
+    auto* column = new QVBoxLayout(&box);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme().px(7));
+    return column;
+}
+
 QFrame* tFrmNewView::group(QVBoxLayout& column, QLabel*& title) {
     auto* card = new QFrame(this);
     setRole(card, "card");
@@ -123,10 +131,7 @@ ToolButton* tFrmNewView::colour(int index, const QString& icon, QColor ink) {
 
 QWidget* tFrmNewView::makePlaceAndLight() {
     auto* box = new QWidget(this);
-    box->setFixedWidth(theme().px(columnWidth));
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(7));
+    QVBoxLayout* column = toolColumn(*box);
     tFrmNew& page = m_page;
 
     // Left is left in both languages.
@@ -194,10 +199,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
 
 QWidget* tFrmNewView::makeFramesAndMore() {
     auto* box = new QWidget(this);
-    box->setFixedWidth(theme().px(columnWidth));
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(7));
+    QVBoxLayout* column = toolColumn(*box);
     tFrmNew& page = m_page;
 
     auto* more = new QFrame(this);

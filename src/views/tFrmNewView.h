@@ -51,6 +51,7 @@ private:
     void makeBars();
     void bindTheRest();
 
+    QVBoxLayout* toolColumn(QWidget& box) const;
     QFrame* group(QVBoxLayout& column, QLabel*& title);
     ToolButton* tool(const QString& name, const Caption& caption, const QString& icon, QSizeF size,
                      std::function<void()> clicked);
