@@ -13,6 +13,7 @@
 #include "platform/QtEventPump.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/Workspace.h"
 #include "support/SamplePhotographs.h"
 #include "support/TestPlatform.h"
 
@@ -201,13 +202,15 @@ private:
         if (!made)
             std::exit(1);
     }
-    HostPath corrected(int i) const { return *m_machine.drives.toHost(EditedPaths::corrected(m_state, drivePath(i))); }
+    HostPath corrected(int i) const {
+        return *m_machine.drives.toHost(WorkspacePaths::corrected(m_state, drivePath(i)));
+    }
 
     Result<QByteArray> rendered(int i) const {
         EditFields edit;
         UnpackEditState(recordOf(i), edit);
         EditedPrint print;
-        print.file = edit.RedMarker == QStringLiteral("RED") ? corrected(i) : source(i);
+        print.file = edit.RedMarker == EditRecord::corrected ? corrected(i) : source(i);
         print.paper = {10, 15};
         print.framesFolder = *m_machine.drives.toHost(QStringLiteral("C:\\2000lumora\\misgarot"));
         return renderEditedPrintToJpeg(print, edit);

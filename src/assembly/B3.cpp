@@ -170,10 +170,10 @@ Result<void> B3::keepToneCopy(const OrderItem& item, NewContent& copy) {
     UnpackEditState(item.record, edit);
     if (Result<void> kept = copy.commit(NewContent::Durability::Passing); !kept)
         return kept;
-    if (edit.RedMarker != QStringLiteral("RED"))
+    if (edit.RedMarker != EditRecord::corrected)
         return {};
-    const QString path = EditedPaths::toneCopy(m_state);
-    return m_platform.files.copyFile(path, EditedPaths::corrected(m_state, path));
+    const QString path = WorkspacePaths::toneCopy(m_state);
+    return m_platform.files.copyFile(path, WorkspacePaths::corrected(m_state, path));
 }
 
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.

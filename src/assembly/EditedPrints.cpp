@@ -53,9 +53,9 @@ EditedPrints::Ahead::Work EditedPrints::rendering(const OrderItem& item) const {
     UnpackEditState(item.record, edit);
     const Drives& drives = m_files.drives();
     const QString source =
-        edit.RedMarker == QStringLiteral("RED") ? EditedPaths::corrected(m_state, item.path) : item.path;
+        edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(m_state, item.path) : item.path;
     const std::optional<HostPath> file = HasQuestionMark(source) ? std::nullopt : drives.toHost(source);
-    const std::optional<HostPath> copy = drives.toHost(EditedPaths::toneCopy(m_state));
+    const std::optional<HostPath> copy = drives.toHost(WorkspacePaths::toneCopy(m_state));
     if (!m_paper || !file || !copy)
         return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source}}; };
     EditedPrint print;
@@ -63,14 +63,6 @@ EditedPrints::Ahead::Work EditedPrints::rendering(const OrderItem& item) const {
     print.paper = *m_paper;
     print.framesFolder = drives.toHost(WorkspacePaths::misgarot(m_state)).value_or(HostPath());
     return [print, edit, copy = *copy] { return render(print, edit, copy); };
-}
-
-QString EditedPaths::toneCopy(const SessionState& state) {
-    return WorkspacePaths::root(state) + QStringLiteral("\\bw.bmp");
-}
-
-QString EditedPaths::corrected(const SessionState& state, const QString& path) {
-    return WorkspacePaths::tempred(state) + u'\\' + MangleFileName(path);
 }
 
 } // namespace lumora

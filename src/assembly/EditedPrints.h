@@ -53,10 +53,4 @@ private:
     std::unique_ptr<Ahead> m_ahead; // last, so that it ends first
 };
 
-// Drive paths of what the renderer reads and leaves.
-namespace EditedPaths {
-QString toneCopy(const SessionState& state);                       // bw.bmp
-QString corrected(const SessionState& state, const QString& path); // the red-eye copy of a picture
-} // namespace EditedPaths
-
 } // namespace lumora

@@ -34,6 +34,12 @@ QString stored(Column column, const QString& text) {
     return cut.mid(from, to - from);
 }
 
+QString frameOfBorder(const QString& paperBorderCode) {
+    if (paperBorderCode == QStringLiteral("WB"))
+        return QStringLiteral("001");
+    return paperBorderCode == QStringLiteral("BK") ? QStringLiteral("002") : noFrame;
+}
+
 } // namespace EditRecord
 
 namespace {
@@ -92,10 +98,9 @@ void UnpackEditState(const QString& record, EditFields& fields) {
 
 void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder) {
     namespace R = EditRecord;
-    const bool white = paperBorderCode == QStringLiteral("WB");
-    const bool black = paperBorderCode == QStringLiteral("BK");
-    if ((white || black) && fields.FrameName == QStringLiteral("000")) {
-        fields.FrameName = white ? QStringLiteral("001") : QStringLiteral("002");
+    const QString frame = R::frameOfBorder(paperBorderCode);
+    if (frame != R::noFrame && fields.FrameName == R::noFrame) {
+        fields.FrameName = frame;
         if (fields.FrameFolder.isEmpty())
             fields.FrameFolder = frameFolder;
     }

@@ -51,6 +51,20 @@ inline constexpr Column TextStyle{95, 2};
 inline constexpr Column TextFont{97, 30};
 inline constexpr Column TextBody{127, 70};
 
+// What the fields hold where they are set. RedMarker: the picture is taken from its corrected copy; AutoMarker: the
+// automatic level step was asked for; in both, notMarked else.
+inline const QString corrected = QStringLiteral("RED");
+inline const QString levelled = QStringLiteral("111");
+inline const QString notMarked = QStringLiteral("000");
+inline const QString noFrame = QStringLiteral("000");      // FrameName of a picture that never had one,
+inline const QString frameRemoved = QStringLiteral("999"); // and of one that lost it
+inline constexpr std::int16_t alignCentre = 1;             // TextAlign; 0: the text begins at its point
+inline constexpr std::int16_t alignFar = 2;
+inline constexpr std::int16_t runsDown = 3; // TextVertical; every other value: across
+
+// The frame that a border of the order stands for, "WB" or "BK"; noFrame for any other.
+QString frameOfBorder(const QString& paperBorderCode);
+
 // What a field becomes in its column: the right end of what is too long is cut, and of a text the blanks around it are
 // not part, while a line break at its beginning is.
 std::int16_t stored(Column column, std::int16_t number);

@@ -34,10 +34,10 @@ PictureCaption captionOf(const EditFields& edit) {
     caption.emSize = R::stored(R::TextFontSize, edit.TextFontSize);
     caption.bold = (edit.TextStyle & 1) != 0;
     caption.italic = (edit.TextStyle & 2) != 0;
-    caption.align = edit.TextAlign == 1   ? PictureCaption::Align::Centre
-                    : edit.TextAlign == 2 ? PictureCaption::Align::Far
-                                          : PictureCaption::Align::Near;
-    caption.run = edit.TextVertical == 3 ? PictureCaption::Run::Down : PictureCaption::Run::Across;
+    caption.align = edit.TextAlign == R::alignCentre ? PictureCaption::Align::Centre
+                    : edit.TextAlign == R::alignFar  ? PictureCaption::Align::Far
+                                                     : PictureCaption::Align::Near;
+    caption.run = edit.TextVertical == R::runsDown ? PictureCaption::Run::Down : PictureCaption::Run::Across;
     caption.colour = QColor(channel(edit.TextRed), channel(edit.TextGreen), channel(edit.TextBlue));
     caption.x = R::stored(R::TextX, edit.TextX);
     caption.y = R::stored(R::TextY, edit.TextY);
@@ -138,7 +138,7 @@ Result<Bitmap> loadGreyPart(const EditedPrint& print, PictureSize wanted, const 
 std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& edit, FrameUse use) {
     const QString name = edit.FrameName.trimmed();
     const QString folder = edit.FrameFolder.trimmed();
-    if (framesFolder.empty() || name.isEmpty() || name == QStringLiteral("000") || name == QStringLiteral("999") ||
+    if (framesFolder.empty() || name.isEmpty() || name == EditRecord::noFrame || name == EditRecord::frameRemoved ||
         !isPlainName(name) || !isPlainName(folder))
         return std::nullopt;
     const auto load = [&](const QString& leaf) -> std::optional<Bitmap> {

@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
+#include "editing/EditRecord.h"
 #include "editing/RedOverview.h"
 #include "editing/tFrmNew.h"
 #include "platform/BlockingCall.h"
@@ -377,7 +378,7 @@ void RedI::Image8_Click() {
             showState();
             return;
         }
-        m_state.edit.RedMarker = u"RED"_s;
+        m_state.edit.RedMarker = EditRecord::corrected;
         static_cast<tFrmNew&>(m_chain.load(PageId::tFrmNew)).Command5_Click();
     }
     close();
@@ -395,7 +396,7 @@ Result<void> RedI::saveCorrected() {
     if (const Result<void> made = files.makeFolder(JoinDrivePath(WorkspacePaths::jobFolder(m_state), u"red_folder"_s));
         !made)
         return made;
-    const QString target = JoinDrivePath(WorkspacePaths::tempred(m_state), MangleFileName(caption));
+    const QString target = WorkspacePaths::corrected(m_state, caption);
     const std::optional<HostPath> host = files.drives().toHost(target);
     if (!host)
         return Failure{Failure::Kind::NotFound, target};

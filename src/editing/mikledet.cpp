@@ -1,6 +1,7 @@
 #include "editing/mikledet.h"
 
 #include "common/FixedText.h"
+#include "editing/EditRecord.h"
 #include "editing/tFrmNew.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
@@ -304,7 +305,7 @@ void mikledet::Image3_Click() {
 
 void mikledet::Image4_Click() {
     std::int16_t& vertical = m_state.edit.TextVertical;
-    vertical = vertical == 3 ? 0 : 3;
+    vertical = vertical == EditRecord::runsDown ? std::int16_t{0} : EditRecord::runsDown;
     commitText();
 }
 

@@ -18,13 +18,6 @@
 #include <algorithm>
 
 namespace lumora {
-namespace {
-
-const QString redMarker = QStringLiteral("RED");
-const QString noMarker = QStringLiteral("000");
-const QString autoMarker = QStringLiteral("111");
-
-} // namespace
 
 tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::tFrmNew)
@@ -126,7 +119,7 @@ void tFrmNew::OpenPictureInEditor() {
     showNumbers();
     if (!m_open)
         return;
-    if (edit().AutoMarker == autoMarker)
+    if (edit().AutoMarker == EditRecord::levelled)
         surfaces().Command2_Click();
     if (edit().ToneFlag == 1)
         surfaces().Command1_Click();
@@ -140,14 +133,14 @@ void tFrmNew::ResetEditorZoom() {
 }
 
 bool tFrmNew::loadPictureOfRecord() {
-    if (edit().RedMarker != redMarker)
+    if (edit().RedMarker != EditRecord::corrected)
         return LoadWorkBitmap(edit().PicturePath);
     edit().TempRedName = MangleFileName(edit().PicturePath);
-    const QString copy = JoinDrivePath(WorkspacePaths::tempred(m_state), edit().TempRedName);
+    const QString copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
     if (m_platform.files.fileExists(copy))
         return LoadWorkBitmap(copy);
     // The picture without the correction, here and in the print, and never what lies under another name.
-    edit().RedMarker = noMarker;
+    edit().RedMarker = EditRecord::notMarked;
     if (!LoadWorkBitmap(edit().PicturePath))
         return false;
     tell(QStringLiteral("תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"),
@@ -320,7 +313,7 @@ void tFrmNew::Command6_Click() {
     if (!m_open)
         return;
     surfaces().Command2_Click();
-    edit().AutoMarker = autoMarker;
+    edit().AutoMarker = EditRecord::levelled;
     packRenderStore();
 }
 

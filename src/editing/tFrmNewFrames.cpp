@@ -1,4 +1,5 @@
 // The editor: frames and line frames.
+#include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
 #include "editing/tFrmNew.h"
 #include "imaging/PictureFile.h"
@@ -9,8 +10,6 @@
 namespace lumora {
 namespace {
 
-const QString noFrame = QStringLiteral("000");
-const QString frameRemoved = QStringLiteral("999");
 constexpr int framePictureSize = 160;
 
 } // namespace
@@ -21,10 +20,7 @@ void tFrmNew::fillFrames(FrameLists::ListFile kind) {
         Combo2List.append(m_frames.names(Combo4.text, kind));
     Label5.text = QString::number(Combo2List.count());
     Label6.text.clear();
-    const QString border = m_state.shemot.Bord.left(2);
-    Combo2.text = border == QStringLiteral("WB")   ? QStringLiteral("001")
-                  : border == QStringLiteral("BK") ? QStringLiteral("002")
-                                                   : noFrame;
+    Combo2.text = EditRecord::frameOfBorder(m_state.shemot.Bord.left(2));
 }
 
 // Another category to choose from; the frame on the picture stays.
@@ -75,7 +71,7 @@ void tFrmNew::Image22_Click() {
     if (!m_open)
         return;
     takeFrame();
-    if (edit().FrameName == noFrame && !Combo2List.isEmpty())
+    if (edit().FrameName == EditRecord::noFrame && !Combo2List.isEmpty())
         Combo2_Click(0);
     Misgerett.checked = true;
     packRenderStore();
@@ -89,7 +85,7 @@ void tFrmNew::Image28_Click() {
     if (!m_open)
         return;
     edit().LineFrameCode = lineFrameLetter() + QStringLiteral("00");
-    edit().FrameName = frameRemoved;
+    edit().FrameName = EditRecord::frameRemoved;
     packRenderStore();
 }
 
@@ -101,7 +97,7 @@ void tFrmNew::Misgerett_Click(bool checked) {
 }
 
 const std::optional<Bitmap>& tFrmNew::frame(const EditFields& fields) {
-    const QString key = Misgerett.checked ? fields.FrameFolder + u'\\' + fields.FrameName : noFrame;
+    const QString key = Misgerett.checked ? fields.FrameFolder + u'\\' + fields.FrameName : EditRecord::noFrame;
     if (key != m_frameKey) {
         m_frameKey = key;
         m_frame = Misgerett.checked ? loadFrame(hostOf(WorkspacePaths::misgarot(m_state)), fields, FrameUse::Preview)

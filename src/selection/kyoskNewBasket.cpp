@@ -69,7 +69,7 @@ void kyoskNew::AddForEditor(int cell) {
     Label1.text = path;
     if (const int index = List1.FindByPath(path); index >= 0) {
         unpackOpen(BasketLine::split(List1.item(index), List1.form()).editState);
-        if (m_state.edit.RedMarker == QStringLiteral("RED"))
+        if (m_state.edit.RedMarker == EditRecord::corrected)
             m_state.edit.TempRedName = MangleFileName(path);
         line.editState = m_state.edit.EditState;
         List1.replaceAt(index, line.compose(List1.form()));

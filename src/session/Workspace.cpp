@@ -59,6 +59,10 @@ QString tempred(const SessionState& state) {
     return zmany(state) + QStringLiteral("\\tempred");
 }
 
+QString corrected(const SessionState& state, const QString& picture) {
+    return JoinDrivePath(tempred(state), MangleFileName(picture));
+}
+
 QString jobFolder(const SessionState& state) {
     return zmany(state) + QStringLiteral("\\job_folder");
 }
@@ -77,6 +81,10 @@ QString scratchPicture(const SessionState& state) {
 
 QString counter(const SessionState& state) {
     return counterFolder(state) + QStringLiteral("\\mispar.txt");
+}
+
+QString toneCopy(const SessionState& state) {
+    return root(state) + QStringLiteral("\\bw.bmp");
 }
 
 QString proofPicture(const SessionState& state) {

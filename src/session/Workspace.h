@@ -11,15 +11,17 @@ struct SessionState;
 
 // Paths of the workspace under the drive root. They are drive paths.
 namespace WorkspacePaths {
-QString root(const SessionState& state);           // 2000lumora
-QString zmany(const SessionState& state);          // passing files
-QString ktanim(const SessionState& state);         // small views that the editor stored
-QString tempred(const SessionState& state);        // working files of the red-eye page
+QString root(const SessionState& state);                              // 2000lumora
+QString zmany(const SessionState& state);                             // passing files
+QString ktanim(const SessionState& state);                            // small views that the editor stored
+QString tempred(const SessionState& state);                           // working files of the red-eye page
+QString corrected(const SessionState& state, const QString& picture); // in tempred: a picture's red-eye copy
 QString jobFolder(const SessionState& state);      // texts and thumbnails of the order in preparation
 QString misgarot(const SessionState& state);       // frames
 QString orders(const SessionState& state);         // !!000: staging, one sub-folder an order
 QString scratchPicture(const SessionState& state); // ^^^.jpg, the picture of the current step
 QString counter(const SessionState& state);        // vedron\mispar.txt
+QString toneCopy(const SessionState& state);       // bw.bmp: the grey picture that the latest toned print came from
 QString proofPicture(const SessionState& state);   // 000.jpg
 } // namespace WorkspacePaths
 

@@ -1,5 +1,6 @@
 #include "views/mikledetView.h"
 
+#include "editing/EditRecord.h"
 #include "views/CaptionField.h"
 #include "views/HoldButton.h"
 #include "views/Keyboard.h"
@@ -272,7 +273,7 @@ void mikledetView::render() {
     m_palette->show(m_page.Picture18Image.image(), qRgb(edit.TextRed, edit.TextGreen, edit.TextBlue));
     static constexpr const char* styles[] = {"letter-regular", "letter-bold", "letter-italic", "letter-bold-italic"};
     showIcon(m_style, QString::fromLatin1(styles[edit.TextStyle & 3]));
-    showIcon(m_direction, edit.TextVertical == 3 ? u"text-down"_s : u"text-across"_s);
+    showIcon(m_direction, edit.TextVertical == EditRecord::runsDown ? u"text-down"_s : u"text-across"_s);
     // A key without a letter types a blank and shows the sign of one.
     for (QPushButton* made : m_keys) {
         const bool blank = made->text().isEmpty();

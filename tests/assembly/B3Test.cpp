@@ -100,7 +100,7 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     giveCorrected(paths[3], fixed);
     const Changes sepia = toned + Changes{{EditRecord::GainB, QStringLiteral("0.5")}};
     const QStringList failed =
-        prepare({edited(paths[0]), edited(paths[1], record(toned)), edited(paths[2], record(corrected)),
+        prepare({edited(paths[0]), edited(paths[1], record(toned)), edited(paths[2], record(redEyesCorrected)),
                  edited(paths[3], record(both)), edited(paths[4], record(toned)), edited(paths[5], record(sepia))});
     EXPECT_EQ(failed, QStringList());
     const QPoint middle(750, 500);
@@ -136,9 +136,9 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
     giveFile(QStringLiteral("old.jpg"), *encodeJpeg(Bitmap(40, 30, Qt::blue), 90));
     ASSERT_TRUE(
         machine.files.copyFile(QStringLiteral("C:\\pics\\old.jpg"), QStringLiteral("C:\\2000lumora\\!!000\\^^^.jpg")));
-    const QStringList failed =
-        prepare({edited(damaged, record(toned)), edited(good, record(toned)), edited(damaged, record(toned)),
-                 edited(vanished, record(corrected)), edited(both4, record(both)), edited(missing), edited(unknown)});
+    const QStringList failed = prepare({edited(damaged, record(toned)), edited(good, record(toned)),
+                                        edited(damaged, record(toned)), edited(vanished, record(redEyesCorrected)),
+                                        edited(both4, record(both)), edited(missing), edited(unknown)});
     EXPECT_EQ(failed, QStringList({damaged, damaged, vanished, both4, missing, unknown}));
     EXPECT_EQ(printFiles(), QStringList(QStringLiteral("1 1015GNB0001_02746F6E656431.jpp")))
         << "failed pictures leave holes in the numbers";

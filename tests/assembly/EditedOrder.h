@@ -26,8 +26,8 @@ inline QString record(const Changes& changes = {}) {
 }
 
 inline const Changes toned = {{EditRecord::ToneFlag, QStringLiteral("1")}};
-inline const Changes corrected = {{EditRecord::RedMarker, QStringLiteral("RED")}};
-inline const Changes both = toned + corrected;
+inline const Changes redEyesCorrected = {{EditRecord::RedMarker, QStringLiteral("RED")}};
+inline const Changes both = toned + redEyesCorrected;
 
 class PreparingAnEditedOrder : public PreparingAPlainOrder {
 protected:

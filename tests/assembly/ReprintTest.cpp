@@ -50,7 +50,7 @@ protected:
                 edited(giveNoise(QStringLiteral("grey1.jpg"), 2400, 1800), record(toned)),
                 edited(giveNoise(QStringLiteral("grey2.jpg"), 300, 400),
                        record(toned + Changes{{GainB, QStringLiteral("0.5")}})),
-                edited(fixed, record(corrected)),
+                edited(fixed, record(redEyesCorrected)),
                 edited(fixedGrey, record(both)),
                 edited(giveNoise(QStringLiteral("תמונה של סבתא.JPG"), 300, 200),
                        record(words(QStringLiteral("חג שמח,\r\n2026 All")))),
