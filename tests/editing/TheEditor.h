@@ -1,0 +1,105 @@
+#pragma once
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "editing/BigPics.h"
+#include "editing/EditRecord.h"
+#include "editing/mikledet.h"
+#include "editing/tFrmNew.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+
+namespace lumora {
+
+inline const QString lying = QStringLiteral("C:\\p\\lying.jpg");
+inline const QString standing = QStringLiteral("C:\\p\\standing.jpg");
+
+// The editor on a fresh drive with two red pictures. stored: the records that it gave away since a picture was opened.
+class TheEditor : public testing::Test {
+protected:
+    TheEditor()
+        : chain(machine.pump) {
+        state.DiskRoot = QStringLiteral("C:\\");
+        state.Optint = 2;
+        state.shemot.ppr = QStringLiteral("10/15");
+        state.shemot.Bord = QStringLiteral("NB");
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
+        EXPECT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\p")));
+        savePicture(lying, {400, 300}, Qt::red);
+        savePicture(standing, {300, 400}, Qt::red);
+        chain.registerPage(PageId::tFrmNew,
+                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
+        chain.registerPage(PageId::mikledet,
+                           [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
+        chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
+    }
+
+    HostPath host(const QString& path) const { return *machine.drives.toHost(path); }
+    void savePicture(const QString& path, PictureSize size, QColor colour) {
+        EXPECT_TRUE(saveJpeg(Bitmap(size.width, size.height, colour), host(path), 95));
+    }
+    // A frame of the preview with the list files that the categories are read by.
+    void makeFrame(const QString& category, const QString& name, QColor colour) {
+        const QString folder = JoinDrivePath(WorkspacePaths::misgarot(state), category);
+        EXPECT_TRUE(machine.files.makeFolder(folder));
+        for (const QString& leaf :
+             {u'k' + name + QStringLiteral(".bmp"), name + QStringLiteral(".bmp"), name + QStringLiteral(".png")})
+            EXPECT_TRUE(Bitmap(30, 20, colour).image().save(toText(host(JoinDrivePath(folder, leaf)))));
+    }
+
+    // The page, its stores recorded.
+    tFrmNew& page() {
+        auto* made = static_cast<tFrmNew*>(chain.find(PageId::tFrmNew));
+        if (made == nullptr) {
+            made = static_cast<tFrmNew*>(&chain.load(PageId::tFrmNew));
+            QObject::connect(made, &tFrmNew::stored, [this] { stored += state.edit.EditState; });
+        }
+        return *made;
+    }
+    tFrmNew& open(const QString& picture, const QString& record = EditRecord::newPicture()) {
+        tFrmNew& editor = page();
+        chain.show(PageId::tFrmNew);
+        UnpackEditState(record, state.edit);
+        state.edit.PicturePath = picture;
+        editor.Command17_Click();
+        stored.clear();
+        return editor;
+    }
+    static QString recordWith(EditRecord::Column column, const QString& value) {
+        return EditRecord::newPicture().replace(column.position - 1, column.width, LeftField(value, column.width));
+    }
+    QString field(EditRecord::Column column) const {
+        return state.edit.EditState.mid(column.position - 1, column.width);
+    }
+    QColor middle() { return page().PicPic.image().pixelColor(page().PicPic.width() / 2, page().PicPic.height() / 2); }
+    QColor corner() { return page().PicPic.image().pixelColor(2, 2); }
+
+    // A button held for so many ticks.
+    static void held(const std::function<void()>& down, const std::function<void()>& tick,
+                     const std::function<void()>& up, int ticks) {
+        down();
+        for (int i = 0; i < ticks; ++i)
+            tick();
+        up();
+    }
+    void holdImage2(int index, int ticks) {
+        const bool zoom = index < 2;
+        held([&] { page().Image2_MouseDown(index); }, [&] { zoom ? page().Timer2_Tick() : page().Timer3_Tick(); },
+             [&] { page().Image2_MouseUp(index); }, ticks);
+    }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain;
+    QStringList stored;
+};
+
+} // namespace lumora
