@@ -57,7 +57,7 @@ struct FtpBoard {
     Caption Label4Diff;          // estimated minutes left; only when the order travels as pieces
     Caption Label4DiffTitle;
     Caption Picture1;      // the bar that runs in each pause
-    int Picture1Width = 0; // 0 to Picture1FullWidth
+    int Picture1Width = 0; // 0 to 266
     Caption Label34;       // which attempt
     bool sending = false;  // a pass or its check is under way: start controls are ignored
 
