@@ -117,4 +117,49 @@ SecondFtpServer::~SecondFtpServer() {
     }
 }
 
+SecondWebServer::SecondWebServer() {
+    std::filesystem::create_directory(uploads());
+    m_server.setProcessChannelMode(QProcess::MergedChannels);
+    const QString configuration = m_folder.filePath(QStringLiteral("lighttpd.conf"));
+    for (int attempt = 0; attempt < 3; ++attempt) {
+        m_port = FreePort();
+        QFile file(configuration);
+        if (!file.open(QIODevice::WriteOnly))
+            break;
+        file.write(
+            QStringLiteral("server.modules = ( \"mod_alias\", \"mod_cgi\", \"mod_setenv\" )\n"
+                           "server.bind = \"127.0.0.1\"\n"
+                           "server.port = %1\n"
+                           "server.document-root = \"%2\"\n"
+                           "server.upload-dirs = ( \"%3\" )\n"
+                           "setenv.set-environment = ( \"LAB_FOLDER\" => \"%3\", \"REDIRECT_STATUS\" => \"200\" )\n"
+                           "alias.url = ( \"/hazmanot/uploads/\" => \"%3/uploads/\" )\n"
+                           "$HTTP[\"url\"] !~ \"^/hazmanot/uploads/\" {\n"
+                           "  cgi.assign = ( \".php\" => \"/usr/bin/php-cgi\", \".asp\" => \"/usr/bin/php-cgi\" )\n"
+                           "}\n")
+                .arg(QString::number(m_port), QStringLiteral(LUMORA_LAB_SCRIPTS "/www"), m_folder.path())
+                .toUtf8());
+        file.close();
+        m_server.start(QStringLiteral("/usr/sbin/lighttpd"),
+                       {QStringLiteral("-D"), QStringLiteral("-f"), configuration});
+        QElapsedTimer waiting;
+        waiting.start();
+        while (m_server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
+            if (answers(m_port))
+                return;
+            m_server.waitForFinished(20);
+        }
+    }
+    m_failure = QStringLiteral("lighttpd did not start: ") + QString::fromUtf8(m_server.readAll());
+}
+
+SecondWebServer::~SecondWebServer() {
+    if (m_server.state() != QProcess::NotRunning) {
+        m_server.terminate();
+        if (!m_server.waitForFinished(5'000))
+            m_server.kill();
+        m_server.waitForFinished(5'000);
+    }
+}
+
 } // namespace lumora

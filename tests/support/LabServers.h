@@ -77,6 +77,26 @@ private:
     quint16 m_port = 0;
 };
 
+// A second kind of web server over the same scripts: lighttpd, which runs php-cgi anew for each request.
+class SecondWebServer {
+public:
+    SecondWebServer();
+    ~SecondWebServer();
+    SecondWebServer(const SecondWebServer&) = delete;
+    SecondWebServer& operator=(const SecondWebServer&) = delete;
+
+    bool running() const { return m_failure.isEmpty(); }
+    QString failure() const { return m_failure; }
+    QString site() const { return QStringLiteral("http://127.0.0.1:%1").arg(m_port); }
+    HostPath uploads() const { return toHostPath(m_folder.path()) / "uploads"; }
+
+private:
+    QTemporaryDir m_folder;
+    QProcess m_server;
+    QString m_failure;
+    quint16 m_port = 0;
+};
+
 // A port of 127.0.0.1 on which nothing listens at the moment.
 quint16 FreePort();
 

@@ -1,0 +1,142 @@
+#include "platform/PocoInternet.h"
+#include "support/LabServers.h"
+#include "support/TcpRelay.h"
+#include "support/UploadFormRig.h"
+
+#include <gtest/gtest.h>
+
+#include <QFile>
+
+#include <filesystem>
+
+// A prepared order, the page that sends by HTTP, and real web servers that run the lab's scripts.
+namespace lumora {
+namespace {
+
+// What a server holds of the order, without the lists.
+std::map<QString, QByteArray> filesIn(const HostPath& folder) {
+    std::map<QString, QByteArray> bytes;
+    std::error_code none;
+    for (const auto& entry : std::filesystem::directory_iterator(folder, none)) {
+        const QString name = toText(entry.path().filename());
+        QFile file(toText(entry.path()));
+        if (!name.startsWith(QStringLiteral("filelist")) && file.open(QIODevice::ReadOnly))
+            bytes[name] = file.readAll();
+    }
+    return bytes;
+}
+
+class SendByHttp : public ::testing::Test {
+protected:
+    void SetUp() override {
+        ASSERT_TRUE(lab.running()) << lab.failure().toStdString();
+        ClientProfile& profile = rig.state.profile;
+        profile.HttpHost = lab.site();
+        profile.ReportUrl = lab.site() + QStringLiteral("/aaaqamootreport/padd.asp");
+        profile.HttpDoneUrl = lab.site() + QStringLiteral("/aaasssppp/p.asp");
+        rig.write(UploadFormRig::second(), everyByte.repeated(900));
+    }
+    HostPath order(const HostPath& uploads) const { return uploads / UploadFormRig::name().toStdString(); }
+
+    QByteArray everyByte = [] {
+        QByteArray bytes;
+        for (int i = 0; i < 256; ++i)
+            bytes.append(static_cast<char>(i));
+        return bytes;
+    }();
+    LabServers lab;
+    PocoInternet internet{TimeLimits{Poco::Timespan(2, 0), Poco::Timespan(5, 0)}};
+    UploadFormRig rig{internet};
+};
+
+TEST_F(SendByHttp, TheOrderArrivesByteForByteWithOneReportAndOneDoneCall) {
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString() << page.TxtWeb.text.toStdString();
+    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+    const QByteArrayList reports = lab.reports();
+    ASSERT_EQ(reports.size(), 2);
+    EXPECT_TRUE(reports[0].startsWith("REPORT k1=tarvelmond | t1=2026_11_21_KUP_1234^105 "));
+    EXPECT_EQ(reports[1], "DONE t1=tarvelmond | t2=true");
+}
+
+TEST_F(SendByHttp, ASecondKindOfServerTakesTheSameRequest) {
+    SecondWebServer second;
+    ASSERT_TRUE(second.running()) << second.failure().toStdString();
+    rig.state.profile.HttpHost = second.site();
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString() << page.TxtWeb.text.toStdString();
+    EXPECT_EQ(filesIn(order(second.uploads())), rig.localFiles());
+}
+
+TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
+    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
+    rig.state.profile.HttpHost = QStringLiteral("http://") + relay.host();
+    rig.start();
+    relay.setFaults({.cutDataAfter = 20, .times = 2});
+    rig.countDown();
+    EXPECT_TRUE(rig.page().done) << rig.page().Label4Reason.hint.toStdString();
+    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+}
+
+TEST_F(SendByHttp, AHebrewNameArrivesInTheCodePageAndNoNameLeadsElsewhere) {
+    UploadScript script(rig.test.platform);
+    const QString url = lab.site() + QStringLiteral("/hazmanot/getfile2.php");
+    rig.write(QStringLiteral("דנה.jpg"), "xyz");
+    const auto send = [&](const QString& folder, const QString& name) {
+        return script.MultipartPost(folder, {name}, url, UploadFormRig::folder(), {}, {}, {});
+    };
+    EXPECT_EQ(send(QStringLiteral("tttt"), QStringLiteral("דנה.jpg")), QStringLiteral("stored\r\n"));
+    EXPECT_TRUE(std::filesystem::exists(lab.uploads() / "tttt" / "\xe3\xf0\xe4.jpg"));
+    for (const char* folder : {"..", "../www", "", ".hidden", "a\\b"})
+        EXPECT_NE(send(QString::fromLatin1(folder), UploadFormRig::first()), QStringLiteral("stored\r\n")) << folder;
+    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(lab.uploads()), {}), 1);
+}
+
+TEST_F(SendByHttp, TheTestFormAnnouncesMoreThanItsBodyAndIsTaken) {
+    UploadScript script(rig.test.platform);
+    const QString host = lab.site().mid(7);
+    const QString answer = script.MultipartPostInet(QStringLiteral("tttt"), {UploadFormRig::second()}, host,
+                                                    QStringLiteral("/hazmanot/getfile2.php"), UploadFormRig::folder(),
+                                                    QStringLiteral("v=1"));
+    EXPECT_EQ(answer, QStringLiteral("stored\r\n"));
+    EXPECT_EQ(filesIn(lab.uploads() / "tttt"),
+              (std::map<QString, QByteArray>{{UploadFormRig::second(), everyByte.repeated(900)}}));
+    EXPECT_TRUE(lab.requests(1).value(0).endsWith("HTTP/1.0"));
+}
+
+// Peak memory of this process, in bytes.
+qint64 peakMemory() {
+    QFile status(QStringLiteral("/proc/self/status"));
+    if (!status.open(QIODevice::ReadOnly))
+        return -1;
+    for (const QByteArray& line : status.readAll().split('\n')) {
+        if (line.startsWith("VmHWM:"))
+            return line.mid(6).trimmed().split(' ').value(0).toLongLong() * 1024;
+    }
+    return -1;
+}
+
+TEST_F(SendByHttp, AFileOf20MiBTakesLessThanThreeTimesItsSize) {
+    constexpr qint64 size = 20 * 1024 * 1024;
+    std::filesystem::resize_file(*rig.test.drives.toHost(UploadFormRig::folder() + u'\\' + UploadFormRig::first()),
+                                 size);
+    UploadScript script(rig.test.platform);
+    QFile reset(QStringLiteral("/proc/self/clear_refs"));
+    ASSERT_TRUE(reset.open(QIODevice::WriteOnly));
+    reset.write("5"); // the peak begins anew
+    reset.close();
+    const qint64 before = peakMemory();
+    EXPECT_EQ(script.MultipartPost(QStringLiteral("tttt"), {UploadFormRig::first()},
+                                   lab.site() + QStringLiteral("/hazmanot/getfile2.php"), UploadFormRig::folder(), {},
+                                   {}, {}),
+              QStringLiteral("stored\r\n"));
+    const qint64 taken = peakMemory() - before;
+    RecordProperty("bytes_taken", std::to_string(taken));
+    EXPECT_LT(taken, 3 * size);
+    EXPECT_GT(taken, size) << "the measure is blind";
+    EXPECT_EQ(std::filesystem::file_size(lab.uploads() / "tttt" / UploadFormRig::first().toStdString()),
+              static_cast<std::uintmax_t>(size));
+}
+
+} // namespace
+} // namespace lumora
