@@ -317,8 +317,9 @@ QWidget* hatchalaView::firstFocus() const {
 void hatchalaView::renderMotion() {
     if (isDetached())
         return;
-    m_arrow->setPhase(static_cast<double>(m_page.Label8Top - hatchala::arrowTop) /
-                      (hatchala::arrowBottom - hatchala::arrowTop));
+    // Every second step is as much as an eye follows.
+    const int step = (m_page.Label8Top - hatchala::arrowTop) / 2 * 2;
+    m_arrow->setPhase(static_cast<double>(step) / (hatchala::arrowBottom - hatchala::arrowTop));
     m_advert->setOpening(static_cast<double>(m_page.Picture4Width) / hatchala::pictureWidth);
     m_shops->setReveal(static_cast<double>(m_page.Picture1Width) / hatchala::panelWidth);
 }
