@@ -41,6 +41,7 @@ nnn::nnn(SessionState& state, const Platform& platform, PageChain& chain)
     , m_chain(chain) {
     Frame1.visible = false;
     Label4kpn.visible = false;
+    Command24.visible = false;
     connect(&album, &AlbumPanels::changed, this, &nnn::showStep);
     connect(&album, &AlbumPanels::focusWanted, this, &nnn::focusOn);
     connect(&album, &AlbumPanels::checked, this, &nnn::takeAlbum);

@@ -122,6 +122,7 @@ public:
     Caption Image4;     // decoration of the terms
     Caption Label8;     // the arrow to the last button
     Caption Command3;
+    Caption Command24; // the same of an album; hidden, for the album's own last button presses it
 
     Caption Command2;
     Caption Command4;

@@ -63,6 +63,7 @@ void nnn::setTexts() {
     Command8.text = Command12.text;
     Command6.text = Command12.text;
     Command3.text = s.wording(u"המשך לבחירת התמונות"_qs, u"On to the pictures"_qs);
+    Command24.text = s.wording(u"המשך לדף הבא"_qs, u"On to the next page"_qs);
     Command4.text = s.wording(u"חזור לאחור"_qs, u"Go back"_qs);
     Command2.text = s.wording(u"בטל"_qs, u"Cancel"_qs);
 

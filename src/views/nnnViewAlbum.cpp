@@ -88,6 +88,7 @@ nnnView::Album::Album(nnnView& view)
     m_view.bindHidden(u"Label17"_s, m_album.Label17);
     m_view.bindHidden(u"Label36"_s, m_album.Label36);
     m_view.bindHidden(u"Command23"_s, m_album.Command23);
+    m_view.bindHidden(u"Command24"_s, m_view.m_page.Command24);
 }
 
 void nnnView::Album::addNext(const QString& name, const Caption& caption, void (AlbumPanels::*pressed)()) {
