@@ -12,8 +12,8 @@ QString LeftField(const QString& text, int width);
 // The last width characters, or all of a shorter text.
 QString RightPart(const QString& text, int width);
 
-// Leading-number parse: blanks, tabs and line feeds are passed over wherever they stand in the number, a sign, digits, one
-// point and an exponent (E or D) are taken, and the first other character ends the number. No number gives 0.
+// Leading-number parse: blanks, tabs and line feeds are passed over wherever they stand in the number, a sign, digits,
+// one point and an exponent (E or D) are taken, and the first other character ends the number. No number gives 0.
 double Val(const QString& text);
 
 // Val rounded to the nearest integer, ties to even, and held within 16 bits: what a 16-bit field takes from a text.
@@ -31,7 +31,8 @@ QString ZeroPadded(long long number, int width);
 // A number as plain decimal text with at most seven significant digits, never with an exponent, no trailing zeros.
 QString PlainNumber(float number);
 
-// The size code of a paper text: its first two characters and its last two. "10/15" gives "1015", an empty text an empty code.
+// The size code of a paper text: its first two characters and its last two. "10/15" gives "1015", an empty text an
+// empty code.
 QString SizeCode(const QString& paper);
 
 // True if the text holds a "?": what a character outside the code page has become.
@@ -43,8 +44,8 @@ QString TextToHex(const QString& text);
 // Two hexadecimal digits at a time back to characters of the ANSI code page.
 QString HexToChars(const QString& hex);
 
-// The decimal text of a hexadecimal text, with or without "&H" in front; "00" for what is no number. As the tools that share
-// the format read it, up to four digits are a signed 16-bit number and more a signed 32-bit number.
+// The decimal text of a hexadecimal text, with or without "&H" in front; "00" for what is no number. As the tools that
+// share the format read it, up to four digits are a signed 16-bit number and more a signed 32-bit number.
 QString HexToDecimal(const QString& hex);
 
 } // namespace lumora

@@ -16,8 +16,8 @@ struct Failure {
         NotFound,
         AccessDenied,
         NoSpace,
-        Damaged,      // the data is not what its format says
-        TooLarge,     // beyond a bound that is checked before memory is taken
+        Damaged,  // the data is not what its format says
+        TooLarge, // beyond a bound that is checked before memory is taken
         Unsupported,
         Refused,      // the other side answered no
         Disconnected, // no line, or the line was cut
@@ -33,24 +33,18 @@ template <class T>
 class [[nodiscard]] Result {
 public:
     Result(T value)
-        : m_content(std::in_place_index<0>, std::move(value))
-    {
-    }
+        : m_content(std::in_place_index<0>, std::move(value)) {}
     Result(Failure failure)
-        : m_content(std::in_place_index<1>, std::move(failure))
-    {
-    }
+        : m_content(std::in_place_index<1>, std::move(failure)) {}
 
     bool ok() const { return m_content.index() == 0; }
     explicit operator bool() const { return ok(); }
 
-    T& value()
-    {
+    T& value() {
         assert(ok());
         return *std::get_if<0>(&m_content);
     }
-    const T& value() const
-    {
+    const T& value() const {
         assert(ok());
         return *std::get_if<0>(&m_content);
     }
@@ -59,8 +53,7 @@ public:
     T* operator->() { return &value(); }
     const T* operator->() const { return &value(); }
 
-    const Failure& failure() const
-    {
+    const Failure& failure() const {
         assert(!ok());
         return *std::get_if<1>(&m_content);
     }
@@ -74,14 +67,11 @@ class [[nodiscard]] Result<void> {
 public:
     Result() = default;
     Result(Failure failure)
-        : m_failure(std::move(failure))
-    {
-    }
+        : m_failure(std::move(failure)) {}
 
     bool ok() const { return !m_failure; }
     explicit operator bool() const { return ok(); }
-    const Failure& failure() const
-    {
+    const Failure& failure() const {
         assert(!ok());
         return *m_failure;
     }

@@ -26,7 +26,7 @@ Result<void> HandOverFiles::write(const QStringList& lines, int index) const {
         !written)
         return written;
     return m_files.writePassing(JoinDrivePath(folder, onePicName(index)),
-                              AnsiCodePage::encode(lines.value(index) + QStringLiteral("\r\n")));
+                                AnsiCodePage::encode(lines.value(index) + QStringLiteral("\r\n")));
 }
 
 } // namespace lumora

@@ -34,8 +34,9 @@ public:
         static constexpr QColor DangerSoft{0xFB, 0xE6, 0xE3};
         static constexpr QColor Good{0x2B, 0x70, 0x3F};
         static constexpr QColor GoodSoft{0xE1, 0xF1, 0xE4};
-        static constexpr QColor SkySoft{0xD6, 0xEA, 0xF8};    // the buttons that move the circle on a red eye
-        static constexpr QColor VioletSoft{0xE6, 0xDC, 0xF5}; // and those that size it: the page's texts name the colours
+        // The red-eye page's texts name these two: the buttons that move the circle, and those that size it.
+        static constexpr QColor SkySoft{0xD6, 0xEA, 0xF8};
+        static constexpr QColor VioletSoft{0xE6, 0xDC, 0xF5};
         static constexpr QColor Marker{0xFF, 0xD9, 0x1A};     // the yellow circle itself
         static constexpr QColor Focus{0x1F, 0x5F, 0xE0};      // the ring around the control that has the keyboard
         static constexpr QColor Veil{0x1D, 0x25, 0x2C, 0x99}; // over a page that has a panel in front

@@ -12,23 +12,21 @@
 
 #include <functional>
 
-// A platform for tests: real files in a temporary folder, hand-written fakes for what a person, a clock or a line would answer.
+// A platform for tests: real files in a temporary folder, hand-written fakes for what a person, a clock or a line would
+// answer.
 namespace lumora {
 
 class RecordedDialogs : public Dialogs {
 public:
-    void message(const QString& text, const QString& title = {}) override
-    {
+    void message(const QString& text, const QString& title = {}) override {
         messages += text;
         titles += title;
     }
-    bool ask(const QString& question) override
-    {
+    bool ask(const QString& question) override {
         questions += question;
         return !answers.isEmpty() && answers.takeFirst();
     }
-    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override
-    {
+    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override {
         pickRequests += prompt + u'|' + initialFolder + u'|' + title;
         return picks.isEmpty() ? QString() : picks.takeFirst();
     }
@@ -37,8 +35,8 @@ public:
     QStringList titles;
     QStringList questions;
     QStringList pickRequests;
-    QStringList picks;    // answers of the next file dialogs, in order
-    QList<bool> answers;  // answers of the next questions, in order
+    QStringList picks;   // answers of the next file dialogs, in order
+    QList<bool> answers; // answers of the next questions, in order
 };
 
 class FixedClock : public Clock {
@@ -50,8 +48,7 @@ public:
 // Counts the pumps; a test may let something happen at one, as a click that arrives meanwhile.
 class ScriptedPump : public EventPump {
 public:
-    void pump() override
-    {
+    void pump() override {
         ++count;
         if (onPump && !m_pumping) {
             m_pumping = true;
@@ -81,8 +78,7 @@ public:
 
 class FixedVolume : public Volume {
 public:
-    Result<std::int32_t> serial(const QString&) const override
-    {
+    Result<std::int32_t> serial(const QString&) const override {
         if (fails)
             return Failure{Failure::Kind::Other, QStringLiteral("no serial")};
         return number;
@@ -96,8 +92,8 @@ class NoInternet : public Internet {
 public:
     bool open() override { return false; }
     bool connectedState() const override { return false; }
-    Result<std::unique_ptr<FtpConnection>> connectFtp(const QString&, const QString&, const QString&, DataChannel) override
-    {
+    Result<std::unique_ptr<FtpConnection>> connectFtp(const QString&, const QString&, const QString&,
+                                                      DataChannel) override {
         return noLine();
     }
     Result<QByteArray> fetch(const QString&) override { return noLine(); }
@@ -112,19 +108,19 @@ private:
 class TestPlatform {
 public:
     TestPlatform()
-        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C', {HostPath(folder.path().toStdString()) / "media"})
+        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C',
+                 {HostPath(folder.path().toStdString()) / "media"})
         , files(drives)
-        , platform{files, dialogs, noInternet, shell, clock, pump, volume}
-    {
+        , platform{files, dialogs, noInternet, shell, clock, pump, volume} {
         std::filesystem::create_directories(drives.dataFolder());
         std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
     }
     // The same with a line.
     explicit TestPlatform(Internet& internet)
-        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C', {HostPath(folder.path().toStdString()) / "media"})
+        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C',
+                 {HostPath(folder.path().toStdString()) / "media"})
         , files(drives)
-        , platform{files, dialogs, internet, shell, clock, pump, volume}
-    {
+        , platform{files, dialogs, internet, shell, clock, pump, volume} {
         std::filesystem::create_directories(drives.dataFolder());
         std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
     }

@@ -64,7 +64,8 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15},
         {"no list is given out", [](FakeWebLab& l) { l.refusesLists = true; }, false, 15},
         {"a list without a total",
-         [](FakeWebLab& l) { l.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"; }, false, 15},
+         [](FakeWebLab& l) { l.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"; }, false,
+         15},
         {"a short list", [](FakeWebLab& l) { l.listInstead = "total:5"; }, false, 15},
         {"four files lost, so that no list has their number",
          [](FakeWebLab& l) {
