@@ -16,15 +16,6 @@ Bitmap turned(const Bitmap& picture, QuarterTurn turn) {
     return Bitmap(picture.image().transformed(QTransform().rotate(static_cast<int>(turn))));
 }
 
-void drawTurned(Bitmap& target, const QRect& box, const Bitmap& picture, QuarterTurn turn) {
-    const bool onItsSide = turn == QuarterTurn::Right || turn == QuarterTurn::Left;
-    const PictureSize upright =
-        onItsSide ? PictureSize{box.height(), box.width()} : PictureSize{box.width(), box.height()};
-    const Bitmap scaled = turned(resampled(picture, upright), turn);
-    if (!target.isNull() && !scaled.isNull())
-        QPainter(&target.image()).drawImage(box.topLeft(), scaled.image());
-}
-
 QString installedFamily(const QString& family) {
     const QString known = family == QStringLiteral("David") ? QStringLiteral("David CLM") : family;
     return QFontDatabase::hasFamily(known) ? known : QString();

@@ -14,9 +14,6 @@ enum class QuarterTurn { None = 0, Right = 90, Half = 180, Left = 270 };
 
 Bitmap turned(const Bitmap& picture, QuarterTurn turn);
 
-// The picture turned and then scaled smoothly to fill the box exactly; what lies outside the target is clipped.
-void drawTurned(Bitmap& target, const QRect& box, const Bitmap& picture, QuarterTurn turn);
-
 // The family to draw with: "David" stands for "David CLM". Empty when this machine lacks it.
 QString installedFamily(const QString& family);
 

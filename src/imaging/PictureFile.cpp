@@ -169,12 +169,4 @@ Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, Pictu
     return memoryIsShort(source);
 }
 
-Result<void> scalePictureFile(const std::filesystem::path& source, const std::filesystem::path& target,
-                              PictureSize size, int quality) {
-    auto bytes = scalePictureToJpeg(source, size, quality);
-    if (!bytes)
-        return bytes.failure();
-    return writeWholeFile(target, *bytes);
-}
-
 } // namespace lumora

@@ -61,8 +61,4 @@ Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, 
 Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
                                       PictureTimes* times = nullptr);
 
-// The same into a file, written whole or not at all.
-Result<void> scalePictureFile(const std::filesystem::path& source, const std::filesystem::path& target,
-                              PictureSize size, int quality);
-
 } // namespace lumora

@@ -32,7 +32,6 @@ Page& PageChain::load(PageId id) {
     Page& page = *(m_pages[id] = m_makers.at(id)());
     page.load();
     page.setTexts();
-    Q_EMIT made(&page);
     return page;
 }
 

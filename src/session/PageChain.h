@@ -44,7 +44,6 @@ public:
     bool hasEnded() const { return m_ended; }
 
 Q_SIGNALS:
-    void made(lumora::Page* page);
     void shown(lumora::Page* page);
     void unloaded(lumora::Page* page);
     void ended();

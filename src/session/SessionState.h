@@ -189,7 +189,6 @@ struct SessionState {
     std::int16_t MinuyPaar = 1;          // 2: changes the menu
     std::int16_t TmunatPaar = 0;         // 1: adds a menu tile and a step behind preparation
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
-    static constexpr int EditStateLength = 200;
 
     ClientProfile profile;
     OrderDetails shemot;
