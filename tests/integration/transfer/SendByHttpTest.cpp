@@ -104,6 +104,9 @@ TEST_F(SendByHttp, TheTestFormAnnouncesMoreThanItsBodyAndIsTaken) {
     EXPECT_TRUE(lab.requests(1).value(0).endsWith("HTTP/1.0"));
 }
 
+// The address sanitizer's allocator holds on to what was freed, so that there the peak tells nothing.
+#ifndef __SANITIZE_ADDRESS__
+
 // Peak memory of this process, in bytes.
 qint64 peakMemory() {
     QFile status(QStringLiteral("/proc/self/status"));
@@ -137,6 +140,8 @@ TEST_F(SendByHttp, AFileOf20MiBTakesLessThanThreeTimesItsSize) {
     EXPECT_EQ(std::filesystem::file_size(lab.uploads() / "tttt" / UploadFormRig::first().toStdString()),
               static_cast<std::uintmax_t>(size));
 }
+
+#endif
 
 } // namespace
 } // namespace lumora
