@@ -1,13 +1,6 @@
-#include "entry/nnn.h"
-
 #include "entry/DetailStore.h"
-#include "session/ClientProfile.h"
-#include "session/Deployment.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "support/TestPlatform.h"
 
-#include <gtest/gtest.h>
+#include "DetailsPageTest.h"
 
 #include <functional>
 
@@ -18,21 +11,11 @@ using Panel = AlbumPanels::Panel;
 
 constexpr int albumTile = 6;
 const QString photographerStore = QStringLiteral("C:\\2000lumora\\pratim2.txt");
-const QString customerStore = QStringLiteral("C:\\2000lumora\\pratim.txt");
 
-class AlbumTest : public ::testing::Test {
+class AlbumTest : public DetailsPageTest {
 protected:
-    AlbumTest() {
-        state.DiskRoot = machine.drives.programRoot();
-        state.KodMishloach = QStringLiteral("KUP");
-        chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
-        chain.registerPage(PageId::nnn, [this] { return std::make_unique<nnn>(state, machine.platform, chain); });
-    }
     nnn& start() {
-        LoadDefaultProfile(state, deployment);
-        machine.dialogs.messages.clear();
-        chain.show(PageId::nnn);
-        nnn& page = static_cast<nnn&>(*chain.front());
+        nnn& page = DetailsPageTest::start();
         page.Image1_Click(albumTile);
         return page;
     }
@@ -65,11 +48,6 @@ protected:
         album.Check6_Click(true);
         return page;
     }
-
-    TestPlatform machine;
-    SessionState state;
-    Deployment deployment;
-    PageChain chain{machine.pump};
 };
 
 TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {

@@ -1,37 +1,13 @@
-#include "entry/nnn.h"
+#include "DetailsPageTest.h"
 
 #include "common/DrivePathText.h"
-#include "entry/Havharot.h"
-#include "session/ClientProfile.h"
-#include "session/Deployment.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "support/TestPlatform.h"
-
-#include <gtest/gtest.h>
 
 namespace lumora {
 namespace {
 
-const QString customerStore = QStringLiteral("C:\\2000lumora\\pratim.txt");
-
-class nnnTest : public ::testing::Test {
+class nnnTest : public DetailsPageTest {
 protected:
-    nnnTest() {
-        state.DiskRoot = machine.drives.programRoot();
-        state.KodMishloach = QStringLiteral("KUP");
-        for (const PageId id : {PageId::hatchala, PageId::kyoskNew})
-            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
-        chain.registerPage(PageId::Havharot,
-                           [this] { return std::make_unique<Havharot>(state, machine.platform, chain); });
-        chain.registerPage(PageId::nnn, [this] { return std::make_unique<nnn>(state, machine.platform, chain); });
-    }
-    nnn& start() {
-        LoadDefaultProfile(state, deployment);
-        chain.show(PageId::nnn);
-        return static_cast<nnn&>(*chain.front());
-    }
     // A print order as far as the terms.
     nnn& atTerms(int tile) {
         nnn& page = start();
@@ -47,11 +23,6 @@ protected:
         }
         return page;
     }
-
-    TestPlatform machine;
-    SessionState state;
-    Deployment deployment;
-    PageChain chain{machine.pump};
 };
 
 TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {

@@ -37,6 +37,18 @@ bool answers(quint16 port) {
     }
 }
 
+// False when the server ended, as on a port that another took meanwhile, or never answered.
+bool comesUp(QProcess& server, quint16 port) {
+    QElapsedTimer waiting;
+    waiting.start();
+    while (server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
+        if (answers(port))
+            return true;
+        server.waitForFinished(20);
+    }
+    return false;
+}
+
 } // namespace
 
 quint16 FreePort() {
@@ -99,13 +111,8 @@ SecondFtpServer::SecondFtpServer() {
                         QStringLiteral("127.0.0.1"), QStringLiteral("-p"), QString::number(m_port),
                         QStringLiteral("-w"), QStringLiteral("-d"), m_folder.path(), QStringLiteral("-u"), user(),
                         QStringLiteral("-P"), password()});
-        QElapsedTimer waiting;
-        waiting.start();
-        while (m_server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
-            if (answers(m_port))
-                return;
-            m_server.waitForFinished(20);
-        }
+        if (comesUp(m_server, m_port))
+            return;
     }
     m_failure = QStringLiteral("pyftpdlib did not start: ") + QString::fromUtf8(m_server.readAll());
 }
@@ -142,13 +149,8 @@ SecondWebServer::SecondWebServer() {
         file.close();
         m_server.start(QStringLiteral("/usr/sbin/lighttpd"),
                        {QStringLiteral("-D"), QStringLiteral("-f"), configuration});
-        QElapsedTimer waiting;
-        waiting.start();
-        while (m_server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
-            if (answers(m_port))
-                return;
-            m_server.waitForFinished(20);
-        }
+        if (comesUp(m_server, m_port))
+            return;
     }
     m_failure = QStringLiteral("lighttpd did not start: ") + QString::fromUtf8(m_server.readAll());
 }
