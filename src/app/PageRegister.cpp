@@ -16,6 +16,7 @@
 #include "session/hatchala.h"
 #include "transfer/FtpFrm.h"
 #include "transfer/InetForm.h"
+#include "transfer/UploadForm.h"
 #include "views/B3View.h"
 #include "views/Form2View.h"
 #include "views/Form3View.h"
@@ -23,6 +24,7 @@
 #include "views/HavharotView.h"
 #include "views/MainWindow.h"
 #include "views/RedIView.h"
+#include "views/UploadFormView.h"
 #include "views/hatchalaView.h"
 #include "views/kyoskNewView.h"
 #include "views/mikledetView.h"
@@ -46,6 +48,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::B3, [&] { return std::make_unique<B3>(state, platform, chain); });
     chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
     chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
+    chain.registerPage(PageId::UploadForm, [&] { return std::make_unique<UploadForm>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
 }
 
@@ -80,6 +83,9 @@ void registerViews(MainWindow& window, PageChain& chain, SessionState& state, co
     });
     window.registerView(PageId::RedI, [&](Page& page, const Theme& theme) {
         return std::make_unique<RedIView>(static_cast<RedI&>(page), state, theme);
+    });
+    window.registerView(PageId::UploadForm, [&](Page& page, const Theme& theme) {
+        return std::make_unique<UploadFormView>(static_cast<UploadForm&>(page), state, theme);
     });
     window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
         return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "transfer/UploadForm.h"
+#include "views/PageView.h"
+
+class QFrame;
+
+namespace lumora {
+
+class Gauge;
+
+class UploadFormView : public PageView {
+    Q_OBJECT
+public:
+    UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme);
+    QWidget* firstFocus() const override;
+
+protected:
+    void render() override;
+
+private:
+    QWidget* makeProgress();
+    QWidget* makeSide();
+    void makeBars();
+    void bindTheRest();
+
+    UploadForm& m_page;
+    Gauge* m_gauge = nullptr;
+    QLabel* m_countdown = nullptr;
+    QFrame* m_failure = nullptr;
+    QLabel* m_orderHead = nullptr;
+    QLabel* m_orderName = nullptr;
+    QLabel* m_left = nullptr;
+    QLabel* m_phone = nullptr;
+    QFrame* m_end = nullptr;
+    QPushButton* m_stop = nullptr;
+    QPushButton* m_again = nullptr;
+    QPushButton* m_goOn = nullptr;
+    QPushButton* m_refresh = nullptr;
+    QWidget* m_main = nullptr; // the main action that was in sight last
+};
+
+} // namespace lumora
