@@ -4,6 +4,7 @@
 #include "app/PageRegister.h"
 #include "platform/Drives.h"
 #include "platform/Files.h"
+#include "platform/Instances.h"
 #include "platform/Platform.h"
 #include "platform/PocoInternet.h"
 #include "platform/QtEventPump.h"
@@ -31,12 +32,13 @@ struct Program::Parts {
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
+        , instances(dataFolder)
         , volume(drives)
         , shell(drives)
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files)
-        , platform{files, dialogs, internet, shell, clock, pump, volume} {
+        , platform{files, dialogs, internet, shell, clock, pump, volume, instances} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
     }
 
@@ -44,6 +46,7 @@ struct Program::Parts {
     SessionState state;
     Drives drives;
     Files files;
+    Instances instances;
     StatVolume volume;
     SystemClock clock;
     QtEventPump pump;

@@ -14,7 +14,7 @@ public:
     virtual void message(const QString& text, const QString& title = {}) = 0;
 
     // Waits for the answer; a box that is closed without one is a no.
-    virtual bool ask(const QString& question) = 0;
+    virtual bool ask(const QString& question, const QString& title = {}) = 0;
 
     // One picture file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the
     // list. A character of the path that lies outside the code page comes back as "?".

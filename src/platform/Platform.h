@@ -6,6 +6,7 @@ class Clock;
 class Dialogs;
 class EventPump;
 class Files;
+class Instances;
 class Internet;
 class Shell;
 class Volume;
@@ -19,6 +20,7 @@ struct Platform {
     const Clock& clock;
     EventPump& pump;
     const Volume& volume;
+    const Instances& instances;
 };
 
 } // namespace lumora

@@ -59,13 +59,13 @@ void ScreenDialogs::closeMessages() {
     }
 }
 
-bool ScreenDialogs::ask(const QString& question) {
+bool ScreenDialogs::ask(const QString& question, const QString& title) {
     shownTexts += question;
     if (nextAnswer) {
         if (const std::optional<bool> answer = nextAnswer())
             return *answer;
     }
-    MessagePanel panel(m_window.theme(), &m_window, MessagePanel::Kind::Question, {}, question,
+    MessagePanel panel(m_window.theme(), &m_window, MessagePanel::Kind::Question, title, question,
                        {m_state.wording(QStringLiteral("כן"), QStringLiteral("Yes")),
                         m_state.wording(QStringLiteral("לא"), QStringLiteral("No"))});
     panel.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);

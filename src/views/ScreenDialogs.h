@@ -25,7 +25,7 @@ public:
     ~ScreenDialogs() override;
 
     void message(const QString& text, const QString& title = {}) override;
-    bool ask(const QString& question) override;
+    bool ask(const QString& question, const QString& title = {}) override;
     QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override;
 
     // Runs before a picture is picked, so that cards put in meanwhile are found.

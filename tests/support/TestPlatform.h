@@ -3,6 +3,7 @@
 #include "platform/Dialogs.h"
 #include "platform/Drives.h"
 #include "platform/Files.h"
+#include "platform/Instances.h"
 #include "platform/Internet.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -22,8 +23,9 @@ public:
         messages += text;
         titles += title;
     }
-    bool ask(const QString& question) override {
+    bool ask(const QString& question, const QString& title = {}) override {
         questions += question;
+        questionTitles += title;
         return !answers.isEmpty() && answers.takeFirst();
     }
     QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override {
@@ -34,6 +36,7 @@ public:
     QStringList messages;
     QStringList titles;
     QStringList questions;
+    QStringList questionTitles;
     QStringList pickRequests;
     QStringList picks;   // answers of the next file dialogs, in order
     QList<bool> answers; // answers of the next questions, in order
@@ -108,26 +111,21 @@ private:
 class TestPlatform {
 public:
     TestPlatform()
-        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C',
-                 {HostPath(folder.path().toStdString()) / "media"})
+        : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
-        , platform{files, dialogs, noInternet, shell, clock, pump, volume} {
-        std::filesystem::create_directories(drives.dataFolder());
-        std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
-    }
+        , instances(drives.dataFolder())
+        , platform{files, dialogs, noInternet, shell, clock, pump, volume, instances} {}
     // The same with a line.
     explicit TestPlatform(Internet& internet)
-        : drives(HostPath(folder.path().toStdString()) / "drive_c", u'C',
-                 {HostPath(folder.path().toStdString()) / "media"})
+        : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
-        , platform{files, dialogs, internet, shell, clock, pump, volume} {
-        std::filesystem::create_directories(drives.dataFolder());
-        std::filesystem::create_directories(HostPath(folder.path().toStdString()) / "media");
-    }
+        , instances(drives.dataFolder())
+        , platform{files, dialogs, internet, shell, clock, pump, volume, instances} {}
 
     QTemporaryDir folder;
     Drives drives;
     Files files;
+    Instances instances;
     RecordedDialogs dialogs;
     RecordedShell shell;
     FixedClock clock;
@@ -135,6 +133,13 @@ public:
     FixedVolume volume;
     NoInternet noInternet;
     Platform platform;
+
+private:
+    HostPath made(const char* name) const {
+        const HostPath path = HostPath(folder.path().toStdString()) / name;
+        std::filesystem::create_directories(path);
+        return path;
+    }
 };
 
 } // namespace lumora

@@ -1,0 +1,30 @@
+#include "platform/Instances.h"
+
+#include <fcntl.h>
+
+namespace lumora {
+
+namespace {
+
+struct flock wholeFile(short kind) {
+    struct flock lock = {};
+    lock.l_type = kind;
+    lock.l_whence = SEEK_SET;
+    return lock;
+}
+
+} // namespace
+
+Instances::Instances(const HostPath& dataFolder)
+    : m_file(::open((dataFolder / ".lumora-runs").c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)) {
+    struct flock mine = wholeFile(F_RDLCK);
+    if (m_file.valid())
+        (void)::fcntl(m_file.number(), F_OFD_SETLK, &mine);
+}
+
+bool Instances::another() const {
+    struct flock others = wholeFile(F_WRLCK);
+    return m_file.valid() && ::fcntl(m_file.number(), F_OFD_GETLK, &others) == 0 && others.l_type != F_UNLCK;
+}
+
+} // namespace lumora
