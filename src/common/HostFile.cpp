@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <atomic>
 #include <cerrno>
 #include <cstring>
@@ -82,6 +83,12 @@ Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t 
     }
 }
 
+Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path) {
+    if (::lseek(source.number(), offset, SEEK_SET) < 0)
+        return systemFailure(errno, path);
+    return {};
+}
+
 // The temporary name is short and does not grow from the final one, which may already be as long as a name can be.
 NewContent::NewContent(std::filesystem::path target, QString path)
     : m_target(std::move(target))
@@ -136,6 +143,22 @@ Result<void> NewContent::commit(Durability durability) {
     if (folder.valid())
         ::fsync(folder.number());
     return {};
+}
+
+Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path) {
+    QByteArray part(static_cast<qsizetype>(std::clamp<qint64>(count, 1, qint64(1) << 20)), Qt::Uninitialized);
+    qint64 done = 0;
+    while (done < count && !target.failed()) {
+        const qint64 wanted = std::min<qint64>(part.size(), count - done);
+        const auto read = readSome(source, part.data(), static_cast<std::size_t>(wanted), path);
+        if (!read)
+            return read.failure();
+        if (*read == 0)
+            break;
+        target.append(part.constData(), *read);
+        done += static_cast<qint64>(*read);
+    }
+    return done;
 }
 
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes) {

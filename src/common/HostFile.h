@@ -6,6 +6,7 @@
 #include <QString>
 
 #include <filesystem>
+#include <limits>
 
 // Files of this machine, read and written whole. A failure's message names the path, or what the caller calls it.
 namespace lumora {
@@ -37,6 +38,9 @@ Result<Descriptor> openSource(const std::filesystem::path& host, const QString& 
 // The next bytes of an open file, up to the capacity given; 0 at the end.
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
 
+// Passes over the first bytes of an open file.
+Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path);
+
 // The new content of a file, beside it under a hidden name until it is whole: a crash or a full disk leaves the old
 // file or the new one. Nothing stays behind when it is not committed.
 class NewContent {
@@ -61,6 +65,11 @@ private:
     Descriptor m_file;
     int m_error = 0;
 };
+
+// Appends the next bytes of the source, up to count of them, and tells how many there were. Stops early when the target
+// has failed, which its commit tells.
+inline constexpr qint64 toTheEnd = std::numeric_limits<qint64>::max();
+Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path);
 
 // All of it at once.
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes);

@@ -61,9 +61,8 @@ void sortWithoutCase(QStringList& names) {
 enum class Wanted { Files, Folders };
 
 // Names as they are, not yet squeezed into the code page. Hidden ones are left out.
-QStringList entries(const HostPath& folder, Wanted wanted) {
+QStringList entries(const HostPath& folder, Wanted wanted, std::error_code& error) {
     QStringList names;
-    std::error_code error;
     for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
         std::error_code unreadable;
         const bool fits = wanted == Wanted::Files ? at->is_regular_file(unreadable) : at->is_directory(unreadable);
@@ -74,8 +73,18 @@ QStringList entries(const HostPath& folder, Wanted wanted) {
     return names;
 }
 
-void collectInto(QStringList& all, const HostPath& folder, const QString& shown, Files::Depth depth) {
-    for (const QString& name : entries(folder, Wanted::Files))
+QStringList entries(const HostPath& folder, Wanted wanted) {
+    std::error_code passedOver;
+    return entries(folder, wanted, passedOver);
+}
+
+void collectInto(QStringList& all, const HostPath& folder, const QString& shown, Files::Depth depth,
+                 QStringList* unreadable) {
+    std::error_code error;
+    const QStringList files = entries(folder, Wanted::Files, error);
+    if (error && unreadable)
+        *unreadable += systemFailure(error.value(), shown).message;
+    for (const QString& name : files)
         all += shown + u'\\' + AnsiCodePage::squeeze(name);
     if (depth == Files::Depth::ThisFolder)
         return;
@@ -83,7 +92,7 @@ void collectInto(QStringList& all, const HostPath& folder, const QString& shown,
         const HostPath sub = folder / toHostPath(name);
         // A link may lead back up, and the walk would never end.
         if (!fs::is_symlink(sub))
-            collectInto(all, sub, shown + u'\\' + AnsiCodePage::squeeze(name), depth);
+            collectInto(all, sub, shown + u'\\' + AnsiCodePage::squeeze(name), depth, unreadable);
     }
 }
 
@@ -176,15 +185,10 @@ Result<void> Files::copyFile(const QString& source, const QString& target) const
     if (!opened)
         return opened.failure();
     NewContent content(*to, target);
-    QByteArray part(qsizetype(1) << 20, Qt::Uninitialized);
-    for (;;) {
-        const auto count = readSome(*opened, part.data(), static_cast<std::size_t>(part.size()), source);
-        if (!count)
-            return count.failure();
-        if (*count == 0)
-            return content.commit();
-        content.append(part.constData(), *count);
-    }
+    const auto copied = appendFrom(*opened, toTheEnd, content, source);
+    if (!copied)
+        return copied.failure();
+    return content.commit();
 }
 
 Result<qint64> Files::size(const QString& path) const {
@@ -224,11 +228,13 @@ QStringList Files::folders(const QString& folder) const {
     return names;
 }
 
-QStringList Files::collect(const QString& folder, Depth depth) const {
+QStringList Files::collect(const QString& folder, Depth depth, QStringList* unreadable) const {
     const auto found = host(folder);
     QStringList all;
     if (found)
-        collectInto(all, *found, folder.endsWith(u'\\') ? folder.chopped(1) : folder, depth);
+        collectInto(all, *found, folder.endsWith(u'\\') ? folder.chopped(1) : folder, depth, unreadable);
+    else if (unreadable)
+        *unreadable += found.failure().message;
     return all;
 }
 

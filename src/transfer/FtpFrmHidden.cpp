@@ -1,6 +1,7 @@
 // The hidden area of the sending page: the older bulk path, the chain of orders, the manual panel of the makers, and
 // the routines that nothing calls.
 #include "common/DrivePathText.h"
+#include "common/PieceName.h"
 #include "platform/Dialogs.h"
 #include "session/Workspace.h"
 #include "transfer/FtpFrm.h"
@@ -291,7 +292,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
         List3.append(log);
     for (const QString& entry : File1.names()) {
         const QString path = JoinDrivePath(folder, entry);
-        const bool selected = !pieces || entry.endsWith(QStringLiteral("prk")) || entry.startsWith(u'!');
+        const bool selected = !pieces || IsPiece(entry) || entry.startsWith(u'!');
         if (selected && path != log)
             List3.append(path);
     }

@@ -1,5 +1,6 @@
 // What the sending page sends: the files of a new order or of a resend, in the order in which they travel.
 #include "common/DrivePathText.h"
+#include "common/PieceName.h"
 #include "editing/gdisave.h"
 #include "platform/Dialogs.h"
 #include "session/PageChain.h"
@@ -71,7 +72,7 @@ void FtpFrm::listFolder() {
         // Without a sheet the entry is the folder itself, and its put fails.
         List3.append(JoinDrivePath(folder, sheet == File1.names().end() ? QString() : *sheet));
         for (const QString& name : File1.names()) {
-            if (name.endsWith(QStringLiteral("prk")))
+            if (IsPiece(name))
                 List3.append(JoinDrivePath(folder, name));
         }
     }

@@ -1,6 +1,7 @@
 #include "transfer/UploadProgress.h"
 
 #include "common/FixedText.h"
+#include "common/PieceName.h"
 
 #include <algorithm>
 #include <cmath>
@@ -20,10 +21,9 @@ double PieceOfOrder::share() const {
 }
 
 std::optional<PieceOfOrder> PieceFromName(const QString& name) {
-    if (!name.endsWith(QStringLiteral("prk")))
+    if (!IsPiece(name))
         return std::nullopt;
-    const QString tail = name.right(11);
-    return PieceOfOrder{tail.left(3), tail.mid(4, 3)};
+    return PieceOfOrder{PieceSequence(name), PieceTotal(name)};
 }
 
 int MinutesLeft(qint64 secondsOfOne, int remaining) {

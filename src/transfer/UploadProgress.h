@@ -12,7 +12,7 @@ int UploadPercent(int index, int count);
 // Width of the inner bar: Int(percent * full / 100).
 int BarWidth(int percent, int full);
 
-// The place of a piece in its order, from the last 11 characters of its name: sequence, "_", total, ".prk".
+// The place of a piece in its order, as its name tells.
 struct PieceOfOrder {
     QString sequence;
     QString total;
