@@ -43,6 +43,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.DegelEdit = false;
     state.MinuyPaar = deployment.MinuyPaar;
     state.TmunatPaar = deployment.TmunatPaar;
+    state.SplitPage = deployment.SplitPage;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.coupon.HaKoopon = deployment.HaKoopon;

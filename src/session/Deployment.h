@@ -23,6 +23,7 @@ struct Deployment {
     bool FitMuzag = false;
     std::int16_t TmunatPaar = 0;
     std::int16_t MinuyPaar = 1;
+    bool SplitPage = false;
     std::int16_t SugTzad = 40;
 
     QChar programLetter = u'C'; // letter of the program's own drive

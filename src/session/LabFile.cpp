@@ -229,6 +229,7 @@ std::vector<Key> addressAndSwitchKeys() {
         {switches, QStringLiteral("FitPage"), yesOrNo, yesNo(&D::FitMuzag, true, false)},
         {switches, QStringLiteral("ExtraTile"), yesOrNo, yesNo<I>(&D::TmunatPaar, 1, 0)},
         {switches, QStringLiteral("QuickOrder"), yesOrNo, yesNo<I>(&D::MinuyPaar, 1, 2)},
+        {switches, QStringLiteral("SplitPage"), yesOrNo, yesNo(&D::SplitPage, true, false)},
         {QStringLiteral("Drives"), QStringLiteral("ProgramLetter"), QStringLiteral("one letter from A to Y"),
          setProgramLetter},
         {QStringLiteral("Drives"), QStringLiteral("DataFolder"),

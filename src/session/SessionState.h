@@ -188,6 +188,7 @@ struct SessionState {
     bool DegelEdit = false;              // shows the editor's spare panel
     std::int16_t MinuyPaar = 1;          // 2: changes the menu
     std::int16_t TmunatPaar = 0;         // 1: adds a menu tile and a step behind preparation
+    bool SplitPage = false;              // the finished orders lead to the pieces, an operator's tool
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
 
     ClientProfile profile;

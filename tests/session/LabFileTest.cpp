@@ -32,7 +32,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "JppTail = 60\n"
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
-              "[Switches]\nCoupon = YES\nQuickOrder = no\nReports = no\nDeepCompression = ask\n"
+              "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = ask\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -48,6 +48,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(lab.profile.QuickSizes[2], u"20/30");
     EXPECT_EQ(lab.HaKoopon, 1);
     EXPECT_EQ(lab.MinuyPaar, 2);
+    EXPECT_TRUE(lab.SplitPage);
     EXPECT_EQ(lab.profile.ReportOn, 0);
     EXPECT_EQ(lab.MediniyutDchisa, 1);
     EXPECT_EQ(lab.profile.Shops[1].phone, u"03-5");
@@ -138,8 +139,8 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
             all += shop.name + shop.phone;
         for (const int number :
              {int(p.JppBase), p.JppChunks, int(p.ReportOn), int(s.MediniyutDchisa), int(s.GvulMuzag), int(s.FitMuzag),
-              int(s.TmunatPaar), int(s.MinuyPaar), int(s.TachanaMekomit), int(s.DoarReshut), int(s.DeliveryChoiceMode),
-              int(s.coupon.HaKoopon), int(s.transfer.SugSheliach)})
+              int(s.TmunatPaar), int(s.MinuyPaar), int(s.SplitPage), int(s.TachanaMekomit), int(s.DoarReshut),
+              int(s.DeliveryChoiceMode), int(s.coupon.HaKoopon), int(s.transfer.SugSheliach)})
             all += QString::number(number);
         return all;
     };
