@@ -8,6 +8,7 @@
 #include "platform/Platform.h"
 #include "platform/PocoInternet.h"
 #include "platform/QtEventPump.h"
+#include "platform/SmtpMail.h"
 #include "platform/StatVolume.h"
 #include "platform/SystemClock.h"
 #include "session/LabFile.h"
@@ -38,7 +39,7 @@ struct Program::Parts {
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files)
-        , platform{files, dialogs, internet, shell, clock, pump, volume, instances} {
+        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
     }
 
@@ -51,6 +52,7 @@ struct Program::Parts {
     SystemClock clock;
     QtEventPump pump;
     PocoInternet internet;
+    SmtpMail mail;
     DesktopShell shell;
     PageChain chain;
     MainWindow window;

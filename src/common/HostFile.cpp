@@ -89,6 +89,24 @@ Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path
     return {};
 }
 
+Result<QByteArray> readWholeFile(const std::filesystem::path& host, const QString& path, qint64 largest) {
+    const auto source = openSource(host, path);
+    if (!source)
+        return source.failure();
+    QByteArray bytes;
+    QByteArray part(qsizetype(1) << 16, Qt::Uninitialized);
+    for (;;) {
+        const auto count = readSome(*source, part.data(), static_cast<std::size_t>(part.size()), path);
+        if (!count)
+            return count.failure();
+        if (*count == 0)
+            return bytes;
+        bytes.append(part.constData(), static_cast<qsizetype>(*count));
+        if (bytes.size() > largest)
+            return systemFailure(EFBIG, path);
+    }
+}
+
 // The temporary name is short and does not grow from the final one, which may already be as long as a name can be.
 NewContent::NewContent(std::filesystem::path target, QString path)
     : m_target(std::move(target))

@@ -41,6 +41,9 @@ Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t 
 // Passes over the first bytes of an open file.
 Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path);
 
+// The whole file; one larger than that many bytes is a failure. path is for the message.
+Result<QByteArray> readWholeFile(const std::filesystem::path& host, const QString& path, qint64 largest);
+
 // The new content of a file, beside it under a hidden name until it is whole: a crash or a full disk leaves the old
 // file or the new one. Nothing stays behind when it is not committed.
 class NewContent {

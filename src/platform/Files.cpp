@@ -149,21 +149,7 @@ Result<QByteArray> Files::read(const QString& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
-    const auto source = openSource(*found, path);
-    if (!source)
-        return source.failure();
-    QByteArray bytes;
-    QByteArray part(qsizetype(1) << 16, Qt::Uninitialized);
-    for (;;) {
-        const auto count = readSome(*source, part.data(), static_cast<std::size_t>(part.size()), path);
-        if (!count)
-            return count.failure();
-        if (*count == 0)
-            return bytes;
-        bytes.append(part.constData(), static_cast<qsizetype>(*count));
-        if (bytes.size() > largestRead)
-            return systemFailure(EFBIG, path);
-    }
+    return readWholeFile(*found, path, largestRead);
 }
 
 Result<void> Files::writeWhole(const QString& path, const QByteArray& bytes) const {

@@ -8,6 +8,7 @@ class EventPump;
 class Files;
 class Instances;
 class Internet;
+class Mail;
 class Shell;
 class Volume;
 
@@ -16,6 +17,7 @@ struct Platform {
     const Files& files;
     Dialogs& dialogs;
     Internet& internet;
+    Mail& mail;
     Shell& shell;
     const Clock& clock;
     EventPump& pump;

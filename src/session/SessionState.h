@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/Mail.h"
+
 #include <QDateTime>
 #include <QString>
 #include <QStringList>
@@ -61,6 +63,7 @@ struct ClientProfile {
     QString AdFile1; // drive paths
     QString AdFile2;
     std::int16_t ReportOn = 0;       // above 0: the reports are sent
+    MailAccount mail;                // finished orders go through it; not set up: no mail step
     std::array<Shop, 2> Shops;       // rows of the delivery question
     std::array<Branch, 11> Branches; // ten shops, then home delivery
 };

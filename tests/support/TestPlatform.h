@@ -6,6 +6,7 @@
 #include "platform/Instances.h"
 #include "platform/Internet.h"
 #include "platform/Machine.h"
+#include "platform/Mail.h"
 #include "platform/Platform.h"
 
 #include <QStringList>
@@ -107,6 +108,19 @@ private:
     static Failure noLine() { return {Failure::Kind::Disconnected, QStringLiteral("no line")}; }
 };
 
+class RecordedMail : public Mail {
+public:
+    MailOutcome send(const MailAccount& account, const MailMessage& message) override {
+        accounts += account;
+        messages += message;
+        return outcomes.isEmpty() ? MailOutcome() : outcomes.takeFirst();
+    }
+
+    QList<MailAccount> accounts; // one for each message
+    QList<MailMessage> messages;
+    QList<MailOutcome> outcomes; // of the next messages, in order; after them all succeed
+};
+
 // The drives C: (in a temporary folder) and Z: with everything that a page asks for.
 class TestPlatform {
 public:
@@ -114,13 +128,13 @@ public:
         : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
         , instances(drives.dataFolder())
-        , platform{files, dialogs, noInternet, shell, clock, pump, volume, instances} {}
+        , platform{files, dialogs, noInternet, mail, shell, clock, pump, volume, instances} {}
     // The same with a line.
     explicit TestPlatform(Internet& internet)
         : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
         , instances(drives.dataFolder())
-        , platform{files, dialogs, internet, shell, clock, pump, volume, instances} {}
+        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances} {}
 
     QTemporaryDir folder;
     Drives drives;
@@ -132,6 +146,7 @@ public:
     ScriptedPump pump;
     FixedVolume volume;
     NoInternet noInternet;
+    RecordedMail mail;
     Platform platform;
 
 private:
