@@ -16,9 +16,12 @@ public:
     // Waits for the answer; a box that is closed without one is a no.
     virtual bool ask(const QString& question, const QString& title = {}) = 0;
 
-    // One picture file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the
-    // list. A character of the path that lies outside the code page comes back as "?".
-    virtual QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) = 0;
+    // One file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the list. A
+    // character of the path that lies outside the code page comes back as "?". Where every file is on offer, the list
+    // opens at initialFolder; pictures are first looked for where customers bring them.
+    enum class Offer { Pictures, EveryFile };
+    virtual QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
+                             Offer offer = Offer::Pictures) = 0;
 };
 
 } // namespace lumora

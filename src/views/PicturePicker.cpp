@@ -25,7 +25,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-enum ItemRole { PathRole = Qt::UserRole, FolderRole, PictureRole, BrokenRole };
+enum ItemRole { PathRole = Qt::UserRole, FolderRole, PictureRole, PlainRole, BrokenRole };
 
 // One cell of the grid: the picture or the folder's sign, and the name below it.
 class CellPainter : public QStyledItemDelegate {
@@ -62,7 +62,10 @@ public:
         } else {
             const bool folder = index.data(FolderRole).toBool();
             const int size = m_theme.px(folder ? 68 : 44);
-            const QString icon = folder ? u"folder"_s : index.data(BrokenRole).toBool() ? u"warning"_s : u"picture"_s;
+            const QString icon = folder                            ? u"folder"_s
+                                 : index.data(PlainRole).toBool()  ? u"document"_s
+                                 : index.data(BrokenRole).toBool() ? u"warning"_s
+                                                                   : u"picture"_s;
             painter->drawPixmap(QPointF(box.center().x() - size / 2.0, box.center().y() - size / 2.0),
                                 m_theme.icon(icon, size, folder ? Theme::Colour::Primary : Theme::Colour::Muted));
         }
@@ -125,11 +128,13 @@ bool holdsAnything(const HostPath& folder) {
 } // namespace
 
 PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                             const QString& prompt, const QString& initialFolder, const QString& title)
+                             const QString& prompt, const QString& initialFolder, const QString& title,
+                             Dialogs::Offer offer)
     : Overlay(theme, parent)
     , m_theme(theme)
     , m_state(state)
-    , m_files(files) {
+    , m_files(files)
+    , m_offer(offer) {
     setObjectName(u"picturePicker"_s);
     setAccessibleName(title.isEmpty() ? prompt : title);
     setFilling();
@@ -139,9 +144,11 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     head->setObjectName(u"pickerPrompt"_s);
     column()->addWidget(head);
     auto* guide = makeLabel(this, "muted");
-    guide->setText(
-        isolated(state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
-                               u"Select only one image of a folder and the program will show you all the images"_s)));
+    guide->setText(isolated(
+        everyFile()
+            ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
+            : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                            u"Select only one image of a folder and the program will show you all the images"_s)));
     guide->setObjectName(u"pickerGuide"_s);
     column()->addWidget(guide);
 
@@ -150,7 +157,8 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     auto* side = new QVBoxLayout;
     side->setSpacing(theme.px(8));
     auto* sideTitle = makeLabel(this, "smallMuted");
-    sideTitle->setText(state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s));
+    sideTitle->setText(everyFile() ? state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
+                                   : state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s));
     side->addWidget(sideTitle);
     m_places = places(initialFolder);
     for (std::size_t i = 0; i < m_places.size(); ++i) {
@@ -194,7 +202,8 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     grid->up = [this] { m_up->click(); };
     m_grid = grid;
     m_grid->setObjectName(u"pickerGrid"_s);
-    m_grid->setAccessibleName(state.wording(u"תיקיות ותמונות"_s, u"Folders and pictures"_s));
+    m_grid->setAccessibleName(everyFile() ? state.wording(u"תיקיות וקבצים"_s, u"Folders and files"_s)
+                                          : state.wording(u"תיקיות ותמונות"_s, u"Folders and pictures"_s));
     m_grid->setItemDelegate(new CellPainter(theme, m_grid));
     m_grid->setViewMode(QListView::IconMode);
     m_grid->setMovement(QListView::Static);
@@ -230,7 +239,9 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     connect(cancel, &QPushButton::clicked, this, [this] { Q_EMIT finished({}); });
     bottom->addWidget(cancel);
     bottom->addStretch(1);
-    m_take = new QPushButton(state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s), this);
+    m_take = new QPushButton(everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
+                                         : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
+                             this);
     setRole(m_take, "main");
     m_take->setObjectName(u"pickerTake"_s);
     m_take->setAccessibleName(m_take->text());
@@ -243,6 +254,12 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     m_reader.setInterval(0);
     connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
     setFirstFocus(m_grid);
+    std::error_code absent;
+    if (const auto initial = m_files.drives().toHost(initialFolder);
+        everyFile() && initial && std::filesystem::is_directory(*initial, absent)) {
+        open(*initial);
+        return;
+    }
     const auto first =
         std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
     open(first != m_places.end() ? first->folder : m_places.front().folder);
@@ -274,7 +291,8 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
     add(m_state.wording(u"הורדות"_s, u"Downloads"_s), u"folder"_s, standard(QStandardPaths::DownloadLocation));
     add(m_state.wording(u"תיקיית הבית"_s, u"Home folder"_s), u"home"_s, standard(QStandardPaths::HomeLocation));
     if (const auto initial = m_files.drives().toHost(initialFolder))
-        add(initialFolder.left(2), u"drive"_s, *initial);
+        add(everyFile() ? toText(initial->filename()) : initialFolder.left(2), everyFile() ? u"folder"_s : u"drive"_s,
+            *initial);
     for (const Drives::Drive& drive : drives)
         addDrive(drive);
     if (result.empty())
@@ -302,7 +320,7 @@ void PicturePicker::open(const HostPath& folder) {
     m_where->setToolTip(toText(folder));
 
     std::vector<HostPath> folders;
-    std::vector<HostPath> pictures;
+    std::vector<HostPath> files;
     std::error_code error;
     std::filesystem::directory_iterator at(folder, error);
     for (; !error && at != std::filesystem::directory_iterator(); at.increment(error)) {
@@ -312,31 +330,34 @@ void PicturePicker::open(const HostPath& folder) {
         std::error_code kind;
         if (at->is_directory(kind))
             folders.push_back(path);
-        else if (isJpeg(path) && at->is_regular_file(kind))
-            pictures.push_back(path);
+        else if ((everyFile() || isJpeg(path)) && at->is_regular_file(kind))
+            files.push_back(path);
     }
     const auto byName = [](const HostPath& a, const HostPath& b) {
         return nameOf(a).compare(nameOf(b), Qt::CaseInsensitive) < 0;
     };
     std::sort(folders.begin(), folders.end(), byName);
-    std::sort(pictures.begin(), pictures.end(), byName);
+    std::sort(files.begin(), files.end(), byName);
     const auto add = [&](const HostPath& path, bool isFolder) {
         auto* item = new QListWidgetItem(nameOf(path), m_grid);
         item->setData(PathRole, QByteArray::fromStdString(path.string()));
         item->setData(FolderRole, isFolder);
         item->setToolTip(nameOf(path));
-        if (!isFolder)
+        item->setData(PlainRole, !isFolder && !isJpeg(path));
+        if (!isFolder && isJpeg(path))
             m_unread.push_back(m_grid->row(item));
     };
     for (const HostPath& path : folders)
         add(path, true);
-    for (const HostPath& path : pictures)
+    for (const HostPath& path : files)
         add(path, false);
     m_empty->setVisible(m_grid->count() == 0);
     m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
                                              u"This folder can't be opened. Choose another place."_s)
-                           : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
-                                             u"There are no pictures here. Choose another place."_s));
+                     : everyFile() ? m_state.wording(u"אין כאן קבצים. בחר מקום אחר."_s,
+                                                     u"There are no files here. Choose another place."_s)
+                                   : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
+                                                     u"There are no pictures here. Choose another place."_s));
     if (m_grid->count() > 0)
         m_grid->setCurrentRow(0, QItemSelectionModel::NoUpdate);
     if (!m_unread.empty())

@@ -81,14 +81,15 @@ bool ScreenDialogs::ask(const QString& question, const QString& title) {
     return yes;
 }
 
-QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title) {
+QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
+                                Offer offer) {
     if (beforePick)
         beforePick();
     if (nextPick) {
         if (const std::optional<QString> pick = nextPick())
             return *pick;
     }
-    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, prompt, initialFolder, title);
+    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, prompt, initialFolder, title, offer);
     picker.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     QEventLoop loop;
     QString chosen;

@@ -26,7 +26,7 @@ public:
 
     void message(const QString& text, const QString& title = {}) override;
     bool ask(const QString& question, const QString& title = {}) override;
-    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override;
+    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title, Offer offer) override;
 
     // Runs before a picture is picked, so that cards put in meanwhile are found.
     std::function<void()> beforePick;

@@ -29,7 +29,7 @@ public:
         questionTitles += title;
         return !answers.isEmpty() && answers.takeFirst();
     }
-    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title) override {
+    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title, Offer) override {
         pickRequests += prompt + u'|' + initialFolder + u'|' + title;
         return picks.isEmpty() ? QString() : picks.takeFirst();
     }
