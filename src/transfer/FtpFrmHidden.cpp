@@ -282,7 +282,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
     const bool pieces = name.endsWith(u'P');
     File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
     if (pieces)
-        m_state.transfer.Mefurak = 1;
+        m_state.transfer.Mefurak = m_state.transfer.HazmanaP = 1;
     m_state.transfer.OrderFolder = folder;
     File1.setFolder(folder);
     File1.refresh();
@@ -292,7 +292,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
         List3.append(log);
     for (const QString& entry : File1.names()) {
         const QString path = JoinDrivePath(folder, entry);
-        const bool selected = !pieces || IsPiece(entry) || entry.startsWith(u'!');
+        const bool selected = m_state.transfer.Mefurak < 1 || IsPiece(entry) || entry.startsWith(u'!');
         if (selected && path != log)
             List3.append(path);
     }

@@ -12,6 +12,7 @@
 #include "transfer/UploadRoom.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace lumora {
 
@@ -127,12 +128,14 @@ void FtpFrm::Command13_Click() {
 }
 
 void FtpFrm::Command1_Click() {
-    if (sending || !settingsFound())
+    if (sending)
+        return;
+    if (const QStringList lines = std::exchange(m_state.handOver.lines, {}); !lines.isEmpty())
+        m_handedOver = lines;
+    if (!settingsFound())
         return;
     enter(Phase::Preparing);
     beginList();
-    m_handedOver = m_state.handOver.lines;
-    m_state.handOver.lines.clear();
     m_chain.unload(PageId::MoogMeret);
     if (!orderIsChosen()) {
         Label7.text = QStringLiteral("0");
@@ -142,7 +145,6 @@ void FtpFrm::Command1_Click() {
     List3.append(m_handedOver);
     Label7.text = QString::number(List3.count());
     const QString& folder = m_state.transfer.OrderFolder;
-    m_state.transfer.HazmanaP = m_state.transfer.ShemTikiya.endsWith(u'P') ? 1 : 0;
     ReadResentDetails(m_platform.files, JoinDrivePath(folder, m_state.transfer.ShemTikiya + QStringLiteral(".txt")),
                       m_state.shemot);
     ShowOrderSummary();
