@@ -10,6 +10,7 @@
 #include "editing/tFrmNew.h"
 #include "entry/Havharot.h"
 #include "entry/nnn.h"
+#include "finished/MoogMeret.h"
 #include "platform/Platform.h"
 #include "selection/kyoskNew.h"
 #include "session/PageChain.h"
@@ -23,6 +24,7 @@
 #include "views/FtpFrmView.h"
 #include "views/HavharotView.h"
 #include "views/MainWindow.h"
+#include "views/MoogMeretView.h"
 #include "views/RedIView.h"
 #include "views/UploadFormView.h"
 #include "views/hatchalaView.h"
@@ -49,6 +51,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::Form2, [&] { return std::make_unique<Form2>(state, platform, chain); });
     chain.registerPage(PageId::FtpFrm, [&] { return std::make_unique<FtpFrm>(state, platform, chain); });
     chain.registerPage(PageId::UploadForm, [&] { return std::make_unique<UploadForm>(state, platform, chain); });
+    chain.registerPage(PageId::MoogMeret, [&] { return std::make_unique<MoogMeret>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
 }
 
@@ -89,6 +92,9 @@ void registerViews(MainWindow& window, PageChain& chain, SessionState& state, co
     });
     window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
         return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);
+    });
+    window.registerView(PageId::MoogMeret, [&](Page& page, const Theme& theme) {
+        return std::make_unique<MoogMeretView>(static_cast<MoogMeret&>(page), state, theme);
     });
 }
 

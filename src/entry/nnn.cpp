@@ -87,9 +87,6 @@ void nnn::Image1_Click(int tile) {
         if (m_chain.show(PageId::MoogMeret)) {
             m_leaving = true;
             m_chain.unload(PageId::nnn);
-        } else {
-            tell(QStringLiteral("דף ההזמנות שהסתיימו עדיין אינו זמין בגרסה זו"),
-                 QStringLiteral("The page of finished orders is not yet available in this version"));
         }
         break;
     case AlbumTile:

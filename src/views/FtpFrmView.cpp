@@ -11,6 +11,7 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QListWidget>
+#include <QProgressBar>
 #include <QPushButton>
 #include <QVBoxLayout>
 
@@ -62,9 +63,18 @@ QWidget* FtpFrmView::makeProgress() {
     line(u"Label34"_s, m_page.Label34, "strong");
     auto* minutes = new QHBoxLayout;
     minutes->addStretch(1);
-    minutes->addWidget(label(u"Label4DiffTitle"_s, m_page.Label4DiffTitle, "muted"));
+    m_minutesTitle = label(u"Label4DiffTitle"_s, m_page.Label4DiffTitle, "muted");
+    m_minutesTitle->setWordWrap(false);
+    minutes->addWidget(m_minutesTitle);
     minutes->addWidget(label(u"Label4Diff"_s, m_page.Label4Diff, "strong"));
     minutes->addStretch(1);
+    m_pieces = new QProgressBar(box);
+    m_pieces->setRange(0, FtpBoard::Pic4ProgWidth);
+    m_pieces->setTextVisible(false);
+    m_pieces->setFixedWidth(theme().px(360));
+    bind(u"PicInProgKatan"_s, m_pieces,
+         [this] { return u"%1 %"_s.arg(m_page.PicInProgKatanWidth * 100 / FtpBoard::Pic4ProgWidth); });
+    column->addWidget(m_pieces, 0, Qt::AlignHCenter);
     column->addLayout(minutes);
     line(u"Label4Do"_s, m_page.Label4Do, "body");
     column->addStretch(1);
@@ -314,6 +324,13 @@ void FtpFrmView::render() {
         m_gauge->show(Val(m_page.Label33.text) / countdownFrom, m_page.Label33.text.trimmed(),
                       wording(u"שניות"_s, u"seconds"_s));
     m_gauge->setAccessibleName(m_page.sending ? m_page.LabelProg.text : m_page.Label4Do.text);
+
+    // The small bar counts the pieces of an order that travels in them; the minutes are known from the second one on.
+    const bool inPieces = m_page.sending && m_page.Label4Diff.visible;
+    m_pieces->setVisible(inPieces);
+    m_pieces->setValue(m_page.PicInProgKatanWidth);
+    m_pieces->setAccessibleName(wording(u"חלקי ההזמנה"_s, u"Pieces of the order"_s));
+    m_minutesTitle->setVisible(m_page.Label4DiffTitle.visible && !m_page.Label4Diff.text.isEmpty());
 
     m_failure->setVisible(failed && (m_page.Picture6.visible || m_page.Label4Reason.visible));
     const auto join = [](std::initializer_list<const Caption*> parts) {

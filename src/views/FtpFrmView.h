@@ -4,6 +4,7 @@
 #include "views/PageView.h"
 
 class QFrame;
+class QProgressBar;
 
 namespace lumora {
 
@@ -31,6 +32,8 @@ private:
     bool m_wasSending = false;
     const Files& m_files;
     Gauge* m_gauge = nullptr;
+    QProgressBar* m_pieces = nullptr;
+    QLabel* m_minutesTitle = nullptr;
     QFrame* m_failure = nullptr;
     QLabel* m_failureLine = nullptr;
     QLabel* m_successLine = nullptr;

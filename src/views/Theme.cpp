@@ -166,9 +166,9 @@ QListWidget { border: 1px solid $Line; border-radius: @14px; background: $Surfac
 QListWidget::item:selected { background: $PrimarySoft; color: $Ink; }
 
 QCheckBox { min-height: %targetpx; spacing: @12px; background: transparent; }
-QCheckBox::indicator { width: @28px; height: @28px; border: 2px solid $Edge; border-radius: @8px; background: $Surface; }
+QCheckBox::indicator, QListWidget::indicator { width: @28px; height: @28px; border: 2px solid $Edge; border-radius: @8px; background: $Surface; }
 QCheckBox::indicator:hover { border-color: $Primary; }
-QCheckBox::indicator:checked { background: $Primary; border-color: $Primary; image: url(:/icons/tick-white.svg); }
+QCheckBox::indicator:checked, QListWidget::indicator:checked { background: $Primary; border-color: $Primary; image: url(:/icons/tick-white.svg); }
 
 QProgressBar { min-height: @18px; max-height: @18px; border: none; border-radius: @9px; background: $Sunken; text-align: center; }
 QProgressBar::chunk { border-radius: @9px; background: $Primary; }

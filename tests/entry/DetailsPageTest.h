@@ -20,7 +20,7 @@ protected:
     DetailsPageTest() {
         state.DiskRoot = machine.drives.programRoot();
         state.KodMishloach = QStringLiteral("KUP");
-        for (const PageId id : {PageId::hatchala, PageId::kyoskNew})
+        for (const PageId id : {PageId::hatchala, PageId::kyoskNew, PageId::MoogMeret})
             chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
         chain.registerPage(PageId::Havharot,
                            [this] { return std::make_unique<Havharot>(state, machine.platform, chain); });

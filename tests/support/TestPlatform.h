@@ -113,11 +113,14 @@ public:
     MailOutcome send(const MailAccount& account, const MailMessage& message) override {
         accounts += account;
         messages += message;
+        if (onSend)
+            onSend();
         return outcomes.isEmpty() ? MailOutcome() : outcomes.takeFirst();
     }
 
     QList<MailAccount> accounts; // one for each message
     QList<MailMessage> messages;
+    std::function<void()> onSend; // what happens while a message is under way
     QList<MailOutcome> outcomes; // of the next messages, in order; after them all succeed
 };
 

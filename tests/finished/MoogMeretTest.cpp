@@ -1,0 +1,379 @@
+#include "finished/MoogMeret.h"
+
+#include "common/ListOutput.h"
+#include "finished/MailResult.h"
+#include "imaging/PictureFile.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QDateTime at(const char* time) {
+    return {QDate(2026, 11, 21), QTime::fromString(QString::fromLatin1(time), u"HH:mm:ss"_s)};
+}
+
+QString leaves(const QStringList& paths) {
+    QStringList names;
+    for (const QString& path : paths)
+        names += path.mid(path.lastIndexOf(u'\\') + 1);
+    return names.join(u' ');
+}
+
+// Two orders on the disk, one of them in pieces, and the page over them.
+class FinishedOrders : public ::testing::Test {
+protected:
+    static inline const QString orders = u"C:\\2000lumora\\!!000"_s;
+    static inline const QString whole = u"2026_11_20_KUP_1234^104"_s;
+    static inline const QString pieces = u"2026_11_21_KUP_1234^105P"_s;
+    static QString in(const QString& order, const QString& leaf) { return orders + u'\\' + order + u'\\' + leaf; }
+
+    FinishedOrders() {
+        state.DiskRoot = u"C:\\"_s;
+        state.shemot.n1 = u"***"_s;
+        for (const QString& folder : {u"C:\\2000lumora"_s, orders, orders + u'\\' + whole, orders + u'\\' + pieces})
+            EXPECT_TRUE(test.files.makeFolder(folder).ok());
+        for (const char* leaf : {"!104_1234.jpp", "02a.jpp", "11b.JPG", "x.txt"})
+            write(whole, QString::fromLatin1(leaf));
+        ListOutput log;
+        log.pair(u"Shemot.n1"_s, u"דנה לוי"_s).pair(u"Shemot.n2"_s, u"03-1234567"_s).pair(u"Shemot.ppr"_s, u"10/15"_s);
+        EXPECT_TRUE(test.files.writeWhole(in(whole, whole + u".txt"_s), log.bytes()).ok());
+        for (const char* leaf :
+             {"!105_1234.jpp", "02a_jpp_001_002.prk", "02a_jpp_002_002.prk", "02a.jpp", "kashloo.txt", "z.jpg"})
+            write(pieces, QString::fromLatin1(leaf));
+        write(pieces, pieces + u".txt"_s);
+        for (const PageId id : {PageId::hatchala, PageId::FtpFrm, PageId::UploadForm, PageId::SpltForm})
+            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
+        chain.registerPage(PageId::MoogMeret,
+                           [this] { return std::make_unique<MoogMeret>(state, test.platform, chain); });
+    }
+
+    void write(const QString& order, const QString& leaf) {
+        EXPECT_TRUE(test.files.writeWhole(in(order, leaf), leaf.toUtf8()).ok());
+    }
+    MoogMeret& start() {
+        chain.show(PageId::MoogMeret);
+        return page();
+    }
+    MoogMeret& startWith(const QString& order) {
+        start().List3_Click(page().List3.find(order));
+        return page();
+    }
+    MoogMeret& page() { return static_cast<MoogMeret&>(*chain.find(PageId::MoogMeret)); }
+    static std::string marked(const MoogMeret& page) {
+        QStringList names;
+        for (int i = 0; i < page.File1.names().count(); ++i) {
+            if (page.File1.isMarked(i))
+                names += page.File1.names().item(i);
+        }
+        return names.join(u' ').toStdString();
+    }
+    void tick(const char* time) {
+        test.clock.time = at(time);
+        page().Timer3_Tick();
+    }
+    // Index and minutes of the package in hand, or "over".
+    std::string walk() {
+        return page().walking()
+                   ? (QString::number(page().List1.currentIndex()) + u' ' + page().Label13.text).toStdString()
+                   : "over";
+    }
+
+    TestPlatform test;
+    SessionState state;
+    PageChain chain{test.pump};
+};
+
+} // namespace
+
+TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
+    MoogMeret& page = start();
+    EXPECT_EQ(page.List3.items(), QStringList({whole, pieces}));
+    EXPECT_EQ(page.List2.items(), QStringList({orders + u'\\' + whole, orders + u'\\' + pieces}));
+    EXPECT_FALSE(page.Picture2.visible);
+    EXPECT_EQ(page.Label23.text, QString());
+
+    struct Case {
+        QString order;
+        const char* marked;
+        int files;
+        int pictures;
+        int Mefurak;
+    };
+    const Case cases[] = {
+        {whole, "!104_1234.jpp 02a.jpp 11b.JPG", 3, 13, 0},
+        {pieces, "!105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk", 6, 4, 1},
+        {whole, "!104_1234.jpp", 4, 0, 1}, // neither the flag nor the pattern goes back, and texts are listed too
+    };
+    for (const Case& c : cases) {
+        page.List3_Click(page.List3.find(c.order));
+        EXPECT_TRUE(page.Picture2.visible);
+        EXPECT_EQ(state.transfer.OrderFolder, orders + u'\\' + c.order);
+        EXPECT_EQ(marked(page), c.marked);
+        EXPECT_EQ(page.Label1.text, QString::number(c.files));
+        EXPECT_EQ(page.Label5.text, QString::number(c.pictures));
+        EXPECT_EQ(state.shemot.TotalPics, c.pictures);
+        EXPECT_EQ(state.transfer.Mefurak, c.Mefurak);
+    }
+    EXPECT_EQ(page.Label4Lakoach.text, u"דנה לוי 03-1234567");
+    page.File1_Click(0);
+    page.File1_Click(page.File1.names().find(whole + u".txt"_s));
+    EXPECT_EQ(page.Label5.text, u"0") << "the year in a text's name is no number of pictures";
+    page.Command21_Click();
+    EXPECT_EQ(page.File1.markedCount(), 0);
+}
+
+TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
+    const QString empty = u"2026_11_19_KUP_1234^103"_s;
+    ASSERT_TRUE(test.files.makeFolder(orders + u'\\' + empty).ok());
+    MoogMeret& page = startWith(empty);
+    EXPECT_EQ(page.Label1.text, u"0");
+    EXPECT_TRUE(page.Label4Reka.visible);
+    EXPECT_TRUE(page.Picture1.isNull());
+    page.Command4_Click();
+    page.Command2_Click();
+    EXPECT_EQ(test.dialogs.messages, QStringList({u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"_s,
+                                                  u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s}));
+    EXPECT_TRUE(page.Command4.visible && page.Command2.visible);
+    EXPECT_EQ(chain.front(), &page);
+
+    std::filesystem::remove_all(*test.drives.toHost(orders));
+    page.Command5_Click();
+    EXPECT_TRUE(page.Label4Rek.visible);
+    EXPECT_FALSE(page.Picture2.visible);
+}
+
+TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
+    struct Case {
+        QString order;
+        const char* touched; // its mark turns over, after all is chosen or after nothing is
+        bool all;
+        QString sent;
+        const char* mailed;
+    };
+    const QString text = whole + u".txt "_s;
+    const Case cases[] = {
+        {whole, "", true, text + u"!104_1234.jpp 02a.jpp 11b.JPG"_s, "!104_1234.jpp 02a.jpp 11b.JPG"},
+        {whole, "02a.jpp", false, text + u"02a.jpp !104_1234.jpp"_s, "!104_1234.jpp 02a.jpp"},
+        {whole, "", false, text + u"!104_1234.jpp"_s, "!104_1234.jpp"},
+        {pieces, "", true, pieces + u".txt !105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"_s,
+         "!105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"},
+    };
+    for (const Case& c : cases) {
+        MoogMeret& page = startWith(c.order);
+        if (!c.all)
+            page.Command21_Click();
+        page.File1_Click(page.File1.names().find(QString::fromLatin1(c.touched)));
+        EXPECT_EQ(leaves(page.File1.mailList()).toStdString(), c.mailed);
+        state.transfer.SugMishloah = 0;
+        page.Command4_Click();
+        ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
+        EXPECT_EQ(leaves(state.handOver.lines).toStdString(), c.sent.toStdString());
+        EXPECT_EQ(state.handOver.lines.value(0), in(c.order, c.order + u".txt"_s));
+        EXPECT_EQ(state.transfer.SugMishloah, 1);
+        EXPECT_EQ(chain.find(PageId::MoogMeret), nullptr);
+        chain.unload(PageId::FtpFrm);
+    }
+    // The order's text may be marked as well, and travels once.
+    MoogMeret& page = startWith(pieces);
+    page.File1_Click(page.File1.names().find(pieces + u".txt"_s));
+    EXPECT_EQ(page.File1.resendList().count(in(pieces, pieces + u".txt"_s)), 1);
+
+    state.transfer.SugSheliach = 1;
+    state.handOver.lines.clear();
+    page.Command4_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::UploadForm);
+    EXPECT_TRUE(state.handOver.lines.isEmpty()) << "that sender takes the folder whole";
+    EXPECT_EQ(state.transfer.OrderFolder, orders + u'\\' + pieces);
+}
+
+TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
+    state.transfer.OrderFolder = orders + u'\\' + whole;
+    state.shemot.n1 = u"Dana"_s;
+    state.handOver.lines = {in(whole, whole)};
+    MoogMeret& page = start();
+    EXPECT_EQ(page.List3.currentItem(), whole);
+    EXPECT_EQ(marked(page), "!104_1234.jpp 02a.jpp 11b.JPG");
+    EXPECT_EQ(leaves(page.List1.items()), whole + u" !104_1234.jpp 02a.jpp 11b.JPG"_s);
+    EXPECT_TRUE(state.handOver.lines.isEmpty());
+    for (const Caption* label : {&page.Label23, &page.Label20, &page.Label10, &page.Label7})
+        EXPECT_EQ(label->text, u"Dana");
+}
+
+TEST_F(FinishedOrders, AskBeforeASecondRunOfTheProgramGoesOn) {
+    for (const bool yes : {true, false}) {
+        const Instances other(test.drives.dataFolder());
+        test.dialogs.answers = {yes};
+        start();
+        EXPECT_TRUE(test.dialogs.questions.takeFirst().startsWith(u"Create another instance of this project"));
+        EXPECT_EQ(test.dialogs.questionTitles.takeFirst(), u"Send E-Mail Project");
+        EXPECT_EQ(chain.hasEnded(), !yes);
+        chain.unload(PageId::MoogMeret);
+    }
+}
+
+TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
+    const HostPath sheet = *test.drives.toHost(in(whole, u"!104_1234.jpp"_s));
+    struct Case {
+        int width, height;
+        int horizontal, vertical;
+    };
+    const Case cases[] = {{100, 80, 0, 0}, {320, 210, 10, 0}, {4000, 3000, 70, 52}, {100, 1000, 0, 52}};
+    for (const Case& c : cases) {
+        ASSERT_TRUE(saveJpeg(Bitmap(c.width, c.height, Qt::red), sheet, 80).ok());
+        MoogMeret& page = startWith(whole);
+        EXPECT_FALSE(page.Picture1.isNull());
+        EXPECT_EQ(page.HScroll1.max, c.horizontal) << c.width;
+        EXPECT_EQ(page.VScroll1.max, c.vertical) << c.height;
+        page.VScroll1_Change(9999);
+        EXPECT_EQ(page.VScroll1.value, c.vertical);
+    }
+    page().List3_Click(1); // begins with a file that is no picture
+    EXPECT_TRUE(page().Picture1.isNull());
+    EXPECT_EQ(page().VScroll1.max + page().VScroll1.value, 0);
+}
+
+TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
+    MoogMeret& page = startWith(whole);
+    test.clock.time = at("10:00:59");
+    page.Command2_Click();
+    EXPECT_FALSE(page.Command2.visible || page.Command4.visible || page.Command18.visible || page.List1Shown.visible);
+    EXPECT_TRUE(page.Label24.visible && page.Timer3.running());
+    EXPECT_EQ(page.Label4Mana.text, u"מנה 1 מתוך 3");
+
+    struct Case {
+        const char* time;
+        const char* walk;
+    };
+    const Case cases[] = {
+        {"10:00:59", "0 0"}, {"10:01:00", "0 1"}, // a border of a minute, a second later
+        {"10:02:59", "0 2"}, {"10:03:00", "0 3"},  {"10:03:01", "1 0"},  {"10:05:59", "1 2"},
+        {"10:06:00", "1 3"}, {"10:06:00", "2 0"},  {"09:30:00", "2 0"}, // the clock was set back
+        {"09:33:00", "2 3"}, {"09:33:00", "over"}, {"09:50:00", "over"},
+    };
+    for (const Case& c : cases) {
+        tick(c.time);
+        EXPECT_EQ(walk(), c.walk) << c.time;
+    }
+    EXPECT_TRUE(page.Command18.visible && page.Command2.visible && page.List1Shown.visible && page.Timer3.running());
+    EXPECT_FALSE(page.Label24.visible);
+    EXPECT_EQ(page.Label4Shaa.text, u"09:50:00") << "the timer runs on";
+    EXPECT_TRUE(test.mail.messages.isEmpty()) << "no mail server is set up";
+}
+
+TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedThen) {
+    MoogMeret& page = startWith(whole);
+    test.clock.time = at("10:00:00");
+    page.Command2_Click();
+    tick("10:03:00");
+    page.Label13_Click();
+    EXPECT_EQ(page.Label13.text, u"0");
+    tick("10:03:00");
+    EXPECT_EQ(walk(), "0 3") << "counted from the start of the package again";
+    tick("10:03:00");
+    EXPECT_EQ(walk(), "1 0");
+    page.Command4_Click();
+    page.List3_Click(1);
+    page.Command5_Click();
+    EXPECT_EQ(page.List3.currentItem(), whole) << "nothing is picked while packages go";
+    page.Command19_Click();
+    EXPECT_FALSE(page.Timer3.running());
+    EXPECT_EQ(page.List1.currentIndex(), 1);
+    EXPECT_TRUE(page.Command18.visible && page.Command2.visible && page.List1Shown.visible);
+
+    page.File1_Click(0);
+    page.File1_Click(1);
+    page.Command2_Click();
+    EXPECT_EQ(leaves(page.List1.items()), u"!104_1234.jpp 11b.JPG");
+    EXPECT_EQ(page.List1.currentIndex(), 0);
+}
+
+TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
+    state.profile.mail.host = u"192.0.2.25"_s;
+    test.mail.outcomes = {{}, {MailEnd::NoContact, u"no route"_s}};
+    MoogMeret& page = startWith(whole);
+    test.clock.time = at("10:00:00");
+    page.Command2_Click();
+    ASSERT_EQ(test.mail.messages.size(), 1) << "the first one at once";
+    EXPECT_EQ(test.mail.messages[0].subject, whole);
+    EXPECT_EQ(test.mail.messages[0].attachment, *test.drives.toHost(in(whole, u"!104_1234.jpp"_s)));
+    for (const char* word : {"דנה לוי", "03-1234567", "10/15", "!104_1234.jpp", "מנה 1 מתוך 3"})
+        EXPECT_TRUE(test.mail.messages[0].body.contains(QString::fromUtf8(word))) << word;
+    EXPECT_TRUE(page.Label4Doar.text.endsWith(MailResultText(0, false).trimmed()));
+
+    for (const char* time : {"10:03:00", "10:03:00", "10:06:00", "10:06:00", "10:09:00", "10:09:00"})
+        tick(time);
+    EXPECT_EQ(walk(), "over");
+    ASSERT_EQ(test.mail.messages.size(), 3);
+    EXPECT_EQ(page.package(1), MoogMeret::Package::Failed);
+    EXPECT_TRUE(page.Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
+    EXPECT_TRUE(test.files.fileExists(in(whole, u"02a.jpp"_s)));
+
+    test.mail.outcomes = {{MailEnd::RecipientRefused, {}}};
+    page.List1_Click(0);
+    EXPECT_EQ(test.mail.messages.size(), 3) << "the server has it";
+    page.List1_Click(1);
+    EXPECT_EQ(page.Label4Doar.text, u"02a.jpp: "_s + MailResultText(14, false));
+    page.List1_Click(1);
+    EXPECT_EQ(test.mail.messages.size(), 5);
+    EXPECT_EQ(test.mail.messages.last().attachment, *test.drives.toHost(in(whole, u"02a.jpp"_s)));
+    EXPECT_EQ(page.Label4Sof.text, u"כל 3 המנות נשלחו בדואר.");
+}
+
+TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
+    state.profile.mail.host = u"192.0.2.25"_s;
+    test.mail.onSend = [&] {
+        MoogMeret& busy = page();
+        EXPECT_TRUE(busy.sending());
+        tick("10:09:00");
+        busy.Command2_Click();
+        busy.Command13_Click();
+        busy.Command4_Click();
+        busy.Command28_Click();
+        busy.List1_Click(1);
+        busy.List3_Click(1);
+        busy.Command5_Click();
+    };
+    MoogMeret& page = startWith(whole);
+    test.clock.time = at("10:00:00");
+    page.Command2_Click();
+    EXPECT_EQ(test.mail.messages.size(), 1);
+    EXPECT_EQ(page.List1.currentIndex(), 0);
+    EXPECT_EQ(chain.front(), &page);
+    EXPECT_EQ(page.Label13.text, u"0") << "the minutes begin when the message is gone";
+
+    // Stopped in the middle of a message: that one is finished, and none follows.
+    test.mail.onSend = [&] { this->page().Command19_Click(); };
+    page.Command19_Click();
+    page.Command2_Click();
+    EXPECT_FALSE(page.walking() || page.Timer3.running());
+    EXPECT_EQ(page.package(0), MoogMeret::Package::Sent);
+    EXPECT_TRUE(page.Command2.visible);
+}
+
+TEST(FinishedOrderTest, TheNameOfAFolderTellsDateAndNumber) {
+    struct Case {
+        const char* name;
+        const char* told;
+    };
+    const Case cases[] = {{"2026_11_21_KUP_1234^105", "21.11.2026 105"},
+                          {"2026_11_21_KUP_1234^105P", "21.11.2026 105 pieces"},
+                          {"2026_11_21_   _^7", "21.11.2026 7"},
+                          {"2026_13_21_KUP_1234^105", ""},
+                          {"meforakim", ""}};
+    for (const Case& c : cases) {
+        const auto order = FinishedOrderOf(QString::fromLatin1(c.name));
+        const QString told = order ? order->date.toString(u"dd.MM.yyyy"_s) + u' ' + order->number +
+                                         (order->pieces ? u" pieces"_s : QString())
+                                   : QString();
+        EXPECT_EQ(told.toStdString(), c.told);
+    }
+}
+
+} // namespace lumora
