@@ -289,12 +289,31 @@ public:
             ++m_line;
             takeLine(line.trimmed());
         }
+        checkSender();
         return std::move(m_reading);
     }
 
 private:
     void fail(const QString& what) {
         m_reading.errors += QStringLiteral("%1:%2: %3").arg(m_fileName).arg(m_line).arg(what);
+    }
+
+    // Each key by itself may be empty; a lab that has chosen HTTP needs all three, or its first order would go nowhere.
+    void checkSender() {
+        if (m_reading.deployment.SugSheliach != 1)
+            return;
+        m_line = m_seen.value(QStringLiteral("Switches.Sender"));
+        const ClientProfile& profile = m_reading.deployment.profile;
+        const std::pair<QString, QString> needed[] = {{QStringLiteral("HttpHost"), profile.HttpHost},
+                                                      {QStringLiteral("HttpTikiya"), profile.HttpTikiya},
+                                                      {QStringLiteral("HttpScriptPath"), profile.HttpScriptPath}};
+        const QString section = QStringLiteral("Addresses");
+        for (const auto& [name, value] : needed) {
+            const QString fullName = section + u'.' + name;
+            if (value.isEmpty() && m_reading.errors.filter(fullName).isEmpty()) // a wrong value is told already
+                fail(QStringLiteral("Switches.Sender is http, and %1 is empty; allowed with http: %2")
+                         .arg(fullName, QString(find(section, name)->allowed).remove(QStringLiteral(", or empty"))));
+        }
     }
 
     void takeLine(const QString& line) {
@@ -336,7 +355,7 @@ private:
             fail(QStringLiteral("the key %1 stands before the first [section]").arg(shown(name)));
             return;
         }
-        const Key* key = find(name);
+        const Key* key = find(m_section, name);
         if (!key) {
             QStringList names;
             for (const Key& known : m_keys) {
@@ -365,9 +384,9 @@ private:
                      : QStringLiteral("%1 has the wrong value \"%2\"; allowed: %3").arg(fullName, value, key->allowed));
     }
 
-    const Key* find(const QString& name) const {
+    const Key* find(const QString& section, const QString& name) const {
         for (const Key& key : m_keys) {
-            if (key.section == m_section && key.name.compare(name, Qt::CaseInsensitive) == 0)
+            if (key.section == section && key.name.compare(name, Qt::CaseInsensitive) == 0)
                 return &key;
         }
         return nullptr;

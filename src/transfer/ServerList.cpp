@@ -41,14 +41,16 @@ QStringList MarkHossarim(const QStringList& files, const QStringList& entries, c
     return missing;
 }
 
-ServerVerdict JudgeServerList(const QString& answer, const QString& folderName) {
+ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {
+    ServerAnswer read;
     if (answer.contains(QStringLiteral("not"), Qt::CaseInsensitive))
-        return ServerVerdict::NotVerified;
-    const QStringList entries = ParseServerList(answer);
-    const bool named = std::any_of(entries.begin(), entries.end(),
+        return read;
+    read.entries = ParseServerList(answer);
+    read.namesFolder = std::any_of(read.entries.begin(), read.entries.end(),
                                    [&](const QString& entry) { return entry.trimmed() == folderName; });
-    const bool counted = std::any_of(entries.begin(), entries.end(), namesTotal);
-    return named && counted ? ServerVerdict::Listed : ServerVerdict::NotVerified;
+    if (read.namesFolder && std::any_of(read.entries.begin(), read.entries.end(), namesTotal))
+        read.verdict = ServerVerdict::Listed;
+    return read;
 }
 
 QString ListFileName(int number) {

@@ -21,9 +21,13 @@ enum class ServerVerdict : int {
     Listed = 1,
 };
 
-// A listing judged: the folder is known, and the list names it and carries a total. The number behind the total is not
-// compared with anything.
-ServerVerdict JudgeServerList(const QString& answer, const QString& folderName);
+// What an answer says of a folder.
+struct ServerAnswer {
+    ServerVerdict verdict = ServerVerdict::NotVerified; // Listed: the list names the folder and carries a total
+    QStringList entries;                                // none where the answer says that the folder is unknown
+    bool namesFolder = false; // with or without a total; the number behind the total is compared with nothing
+};
+ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName);
 
 // The list file of a number on the server: 0 to 3; any other has none and gives an empty name.
 QString ListFileName(int number);

@@ -141,8 +141,7 @@ void UploadForm::enter(Phase phase) {
     done = phase == Phase::Success || phase == Phase::AllThere;
     failed = phase == Phase::NotAll || phase == Phase::NoOrder || phase == Phase::NoServer;
     Command10.visible = phase == Phase::Stopped;
-    if (sending || done)
-        Command3.visible = false;
+    Command3.visible = phase == Phase::Countdown;
     showWhatToDo();
     Q_EMIT changed();
 }
@@ -196,7 +195,7 @@ void UploadForm::startPanel() {
     Picture1.visible = Pic4Timer.visible = Picture5.visible = true;
     Picture1Width = 1;
     Label8.text = QString::number(countdownFrom);
-    Command3.visible = true;
+    Label11.visible = false;
     Timer1.start();
     enter(Phase::Countdown);
 }
@@ -277,12 +276,11 @@ void UploadForm::Timer2_Tick() {
 }
 
 void UploadForm::Command3_Click() {
-    if (!idle() || m_phase != Phase::Countdown)
+    if (!idle() || !Command3.visible)
         return;
     Timer1.stop();
     Timer2.stop();
-    Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
-    Command3.visible = false;
+    Picture1.visible = Pic4Timer.visible = Picture5.visible = Image5.visible = false;
     enter(Phase::Stopped);
 }
 

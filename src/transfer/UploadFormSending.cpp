@@ -54,7 +54,7 @@ void UploadForm::HttpAttempts() {
         Label1.text =
             m_state.wording(QStringLiteral("לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה"),
                             QStringLiteral("After three attempts the computer could not upload the whole order"));
-        Image5.visible = true;
+        Image5.visible = Command3.visible = true;
         enter(Phase::NotAll);
         return;
     }
@@ -94,6 +94,7 @@ void UploadForm::HttpSendFiles(int listNumber) {
     Label9.visible = true;
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php");
     const QStringList files = List4Hossarim.items();
+    qsizetype left = files.size();
     for (int i = 0; i < files.size(); ++i) {
         const QString name = LeafName(files[i]);
         Label4File.text = m_state.wording(QStringLiteral("קובץ %1 מתוך %2: %3"), QStringLiteral("File %1 of %2: %3"))
@@ -109,8 +110,9 @@ void UploadForm::HttpSendFiles(int listNumber) {
             Label4Reason.text = LineTroubleText(m_state, LineStep::Put, m_script.lastFailure(), name);
             Label4Reason.hint = m_script.lastFailure().message;
             Label4Reason.visible = true;
+        } else {
+            Label12.text = QString::number(--left);
         }
-        Label12.text = QString::number(files.size() - i - 1);
         pump();
         Label4.text = QString::number(i);
         ShowHttpProgress();
@@ -119,6 +121,7 @@ void UploadForm::HttpSendFiles(int listNumber) {
     }
     Label4File.text.clear();
     enter(Phase::Verifying);
+    Command3.visible = true;
     if (CheckOrderOnServer(listNumber) != ServerVerdict::Listed)
         takeAllAsMissing();
     showMissingCount();
@@ -165,15 +168,17 @@ ServerVerdict UploadForm::CheckOrderOnServer(int listNumber) {
         return ServerVerdict::NotVerified;
     ListInOrder.clear();
     ListInOrder.append(ParseServerList(TxtFromWeb.text));
-    const ServerVerdict verdict = JudgeServerList(TxtWeb.text, name);
-    ListAfterWeb.append(ParseServerList(TxtWeb.text));
-    if (verdict == ServerVerdict::Listed) {
+    const ServerAnswer answer = ReadServerAnswer(TxtWeb.text, name);
+    ListAfterWeb.append(answer.entries);
+    // What is named counts as arrived even in a list without a total, but such a list is not believed: the whole order
+    // goes again.
+    if (answer.namesFolder) {
         const QStringList missing = MarkHossarim(List4Kvazim.items(), ListAfterWeb.items(), name);
         List4Hossarim.clear();
         List4Hossarim.append(missing);
         showMissingCount();
     }
-    return verdict;
+    return answer.verdict;
 }
 
 void UploadForm::HttpFetchFileListN(int listNumber) {

@@ -6,6 +6,7 @@
 #include "views/Cards.h"
 #include "views/Gauge.h"
 #include "views/Overlay.h"
+#include "views/SendingCards.h"
 
 #include <QGridLayout>
 #include <QHBoxLayout>
@@ -79,22 +80,8 @@ QWidget* FtpFrmView::makeProgress() {
     line(u"Label4Do"_s, m_page.Label4Do, "body");
     column->addStretch(1);
 
-    const auto notice = [&](const char* role, const QString& icon, QColor colour) {
-        auto* made = new QFrame(box);
-        setRole(made, role);
-        auto* inside = new QHBoxLayout(made);
-        inside->setContentsMargins(theme().px(20), theme().px(14), theme().px(20), theme().px(14));
-        inside->setSpacing(theme().px(16));
-        auto* sign = new QLabel(made);
-        sign->setPixmap(theme().icon(icon, theme().px(36), colour));
-        inside->addWidget(sign, 0, Qt::AlignTop);
-        auto* words = new QVBoxLayout;
-        words->setSpacing(theme().px(4));
-        inside->addLayout(words, 1);
-        column->addWidget(made);
-        return std::pair(made, words);
-    };
-    const auto [failure, failureWords] = notice("alarm", u"warning"_s, Theme::Colour::Danger);
+    const auto [failure, failureWords] = makeSignedCard(theme(), box, "alarm", u"warning"_s, Theme::Colour::Danger);
+    column->addWidget(failure);
     m_failure = failure;
     m_failureLine = makeLabel(failure, "strong");
     failureWords->addWidget(m_failureLine);
@@ -111,13 +98,9 @@ QWidget* FtpFrmView::makeSide() {
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(theme().px(14));
     const auto card = [&](const char* role) {
-        auto* made = new QFrame(box);
-        setRole(made, role);
-        auto* inside = new QVBoxLayout(made);
-        inside->setContentsMargins(theme().px(22), theme().px(18), theme().px(22), theme().px(18));
-        inside->setSpacing(theme().px(8));
-        column->addWidget(made);
-        return std::pair(made, inside);
+        const SendingCard made = makeSendingCard(theme(), box, role);
+        column->addWidget(made.frame);
+        return made;
     };
     const auto [order, orderLines] = card("card");
     m_order = order;
@@ -344,8 +327,7 @@ void FtpFrmView::render() {
     m_failureLine->setVisible(m_page.Picture6.visible);
 
     m_orderHead->setText(wording(u"ההזמנה שלך"_s, u"Your order"_s));
-    // Folder names hold underscores and no blanks: they may break behind one.
-    m_orderName->setText(QChar(0x2066) + QString(m_page.Label46.text).replace(u'_', u"_\u200B"_s) + QChar(0x2069));
+    m_orderName->setText(orderNameLine(m_page.Label46.text, state().english()));
     m_counts->setText(isolated(wording(u"%1 תמונות, %2 קבצים"_s, u"%1 prints, %2 files"_s)
                                    .arg(m_page.Label21.text.trimmed(), m_page.Label7.text.trimmed())));
     m_orderName->setVisible(!m_page.Label46.text.isEmpty());

@@ -42,9 +42,10 @@ void Gauge::paintEvent(QPaintEvent*) {
     const double side = std::min(width(), height()) - thick - 2;
     QRectF ring(0, 0, side, side);
     ring.moveCenter(QRectF(rect()).center());
-    const QColor colour = m_mood == Mood::Good  ? Theme::Colour::Good
-                          : m_mood == Mood::Bad ? Theme::Colour::Danger
-                                                : Theme::Colour::Primary;
+    const QColor colour = m_mood == Mood::Good   ? Theme::Colour::Good
+                          : m_mood == Mood::Bad  ? Theme::Colour::Danger
+                          : m_mood == Mood::Held ? Theme::Colour::Edge
+                                                 : Theme::Colour::Primary;
     painter.setPen(QPen(Theme::Colour::Sunken, thick));
     painter.drawEllipse(ring);
     painter.setPen(QPen(colour, thick, Qt::SolidLine, Qt::RoundCap));
@@ -52,9 +53,11 @@ void Gauge::paintEvent(QPaintEvent*) {
         painter.drawArc(ring, 90 * 16, -static_cast<int>(m_share * 360 * 16));
     if (m_mood != Mood::Busy) {
         const int size = static_cast<int>(side * 0.5);
-        painter.drawPixmap(
-            QPointF(ring.center().x() - size / 2.0, ring.center().y() - size / 2.0),
-            m_theme.icon(m_mood == Mood::Good ? QStringLiteral("tick") : QStringLiteral("warning"), size, colour));
+        const QString sign = m_mood == Mood::Good  ? QStringLiteral("tick")
+                             : m_mood == Mood::Bad ? QStringLiteral("warning")
+                                                   : QStringLiteral("pause");
+        painter.drawPixmap(QPointF(ring.center().x() - size / 2.0, ring.center().y() - size / 2.0),
+                           m_theme.icon(sign, size, colour));
         return;
     }
     QFont font = m_theme.font(Theme::Type::Display);

@@ -239,9 +239,11 @@ void Theme::apply(QApplication& application) {
 }
 
 QString isolated(const QString& text) {
-    // Paths, addresses of the web and of mail, sizes, "3 / 12", percentages, telephone numbers.
+    // Paths, addresses of the web and of mail, names of files, sizes, "3 / 12", percentages, telephone numbers.
     static const QRegularExpression ownDirection(
-        u"[A-Za-z]:\\\\[^\\n]*|(?<!\\S)/[^/\\n]+/[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+|\\d+(?:\\s*[/x:.,_-]\\s*\\d+)+(?:\\s?%)?|\\d+\\s?%|\\+\\d+"_s);
+        u"[A-Za-z]:\\\\[^\\n]*|(?<!\\S)/[^/\\n]+/[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+"
+        "|(?<!\\S)[!-~]+\\.[A-Za-z]{3}(?![\\w.])"
+        "|\\d+(?:\\s*[/x,_-]\\s*\\d+|[:.]\\d+)+(?:\\s?%)?|\\d+\\s?%|\\+\\d+"_s);
     QString result = text;
     result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     qsizetype shift = 0;

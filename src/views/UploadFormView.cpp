@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "views/Gauge.h"
+#include "views/SendingCards.h"
 
 #include <QHBoxLayout>
 #include <QLabel>
@@ -53,20 +54,22 @@ QWidget* UploadFormView::makeProgress() {
     line(label(u"Label4Do"_s, m_page.Label4Do, "body"));
     column->addStretch(1);
 
-    m_failure = new QFrame(box);
-    setRole(m_failure, "alarm");
-    auto* inside = new QHBoxLayout(m_failure);
-    inside->setContentsMargins(theme().px(20), theme().px(14), theme().px(20), theme().px(14));
-    inside->setSpacing(theme().px(16));
-    auto* sign = new QLabel(m_failure);
-    sign->setPixmap(theme().icon(u"warning"_s, theme().px(36), Theme::Colour::Danger));
-    inside->addWidget(sign, 0, Qt::AlignTop);
-    auto* words = new QVBoxLayout;
-    words->setSpacing(theme().px(4));
-    words->addWidget(label(u"Label1"_s, m_page.Label1, "strong"));
-    words->addWidget(label(u"Label4Reason"_s, m_page.Label4Reason));
-    inside->addLayout(words, 1);
-    column->addWidget(m_failure);
+    // The same words in two dresses: on the way they are no reason to worry.
+    const auto words = [&](const char* role, const QString& icon, QColor colour) {
+        const SendingCard made = makeSignedCard(theme(), box, role, icon, colour);
+        column->addWidget(made.frame);
+        return made;
+    };
+    const auto [trouble, troubleWords] = words("notice", u"resend"_s, Theme::Colour::Ink);
+    m_trouble = trouble;
+    m_troubleLine = makeLabel(trouble, "strong");
+    troubleWords->addWidget(m_troubleLine);
+    m_troubleReason = makeLabel(trouble, "body");
+    troubleWords->addWidget(m_troubleReason);
+    const auto [failure, failureWords] = words("alarm", u"warning"_s, Theme::Colour::Danger);
+    m_failure = failure;
+    failureWords->addWidget(label(u"Label1"_s, m_page.Label1, "strong"));
+    failureWords->addWidget(label(u"Label4Reason"_s, m_page.Label4Reason));
     return box;
 }
 
@@ -76,15 +79,12 @@ QWidget* UploadFormView::makeSide() {
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(theme().px(14));
     const auto card = [&](const char* role) {
-        auto* made = new QFrame(box);
-        setRole(made, role);
-        auto* inside = new QVBoxLayout(made);
-        inside->setContentsMargins(theme().px(22), theme().px(18), theme().px(22), theme().px(18));
-        inside->setSpacing(theme().px(8));
-        column->addWidget(made);
-        return std::pair(made, inside);
+        const SendingCard made = makeSendingCard(theme(), box, role);
+        column->addWidget(made.frame);
+        return made;
     };
     const auto [order, orderLines] = card("card");
+    m_order = order;
     m_orderHead = makeLabel(order, "smallMuted");
     orderLines->addWidget(m_orderHead);
     m_orderName = makeLabel(order, "strong");
@@ -101,11 +101,15 @@ QWidget* UploadFormView::makeSide() {
     m_end = end;
     endLines->addWidget(label(u"Label4Alu"_s, m_page.Label4Alu, "large"));
     endLines->addWidget(label(u"Label4Rshom"_s, m_page.Label4Rshom, "body"));
-    endLines->addWidget(label(u"Label16"_s, m_page.Label16, "strong"));
-    endLines->addWidget(label(u"Label4Tashlum"_s, m_page.Label4Tashlum, "strong"));
+    m_endName = makeLabel(end, "large");
+    bind(u"Label16"_s, m_endName, [this] { return m_page.Label16.text; });
+    endLines->addWidget(m_endName);
+    endLines->addWidget(label(u"Label4Tashlum"_s, m_page.Label4Tashlum, "body"));
+    m_endPhone = makeLabel(end, "large");
+    endLines->addWidget(m_endPhone);
     column->addStretch(1);
     m_refresh = button(
-        u"Command2"_s, m_page.Command2, Role::Plain, [this] { m_page.Command2_Click(); }, u"resend"_s);
+        u"Command2"_s, m_page.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }, u"resend"_s);
     column->addWidget(m_refresh, 0, Qt::AlignLeading);
     return box;
 }
@@ -118,8 +122,9 @@ void UploadFormView::makeBars() {
     frame().addSecondaryAction(m_stop);
     m_goOn = button(u"Command10"_s, m_page.Command10, Role::Main, [this] { m_page.Command10_Click(); });
     m_again = button(u"Image5"_s, m_page.Image5, Role::Main, [this] { m_page.Image5_Click(); });
-    frame().addMainAction(m_goOn);
-    frame().addMainAction(m_again);
+    m_close = button(u"endClose"_s, m_page.Image3, Role::Main, [this] { m_page.Image3_Click(); });
+    for (QPushButton* main : {m_goOn, m_again, m_close})
+        frame().addMainAction(main);
 }
 
 void UploadFormView::bindTheRest() {
@@ -145,8 +150,9 @@ QWidget* UploadFormView::firstFocus() const {
 }
 
 void UploadFormView::render() {
-    const bool counting = m_page.Picture1.visible && m_page.Command3.visible && !m_page.done;
+    const bool counting = m_page.Picture1.visible && m_page.Command3.visible && !m_page.failed;
     const bool waiting = m_page.Command10.visible;
+    const bool checking = !m_page.done && !m_page.failed && !m_page.sending && !counting && !waiting;
     window()->setWindowTitle(m_page.caption.trimmed().isEmpty() ? u"Lumora"_s : m_page.caption.simplified());
     frame().steps().setStep(m_page.done ? OrderStep::Done : OrderStep::Sending);
     frame().setTitle(m_page.done     ? wording(u"ההזמנה נשלחה"_s, u"Your order was sent"_s)
@@ -158,35 +164,50 @@ void UploadFormView::render() {
         m_gauge->showSign(Gauge::Mood::Good);
     else if (m_page.failed)
         m_gauge->showSign(Gauge::Mood::Bad);
-    else if (m_page.sending || !(counting || waiting))
-        m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
-    else
+    else if (waiting)
+        m_gauge->showSign(Gauge::Mood::Held);
+    else if (counting)
         m_gauge->show(Val(m_page.Label8.text) / countdownFrom, m_page.Label8.text.trimmed(),
                       m_page.Label14.text.trimmed());
+    else if (checking)
+        m_gauge->show(0, u"…"_s, wording(u"בודקים"_s, u"checking"_s));
+    else
+        m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
     m_gauge->setAccessibleName(m_page.Label4Do.text);
     m_countdown->setText(counting ? m_page.Label13.text.trimmed() + u' ' + m_page.Label8.text + u' ' +
                                         m_page.Label14.text.trimmed()
                          : m_page.Label11.visible ? m_page.Label11.text
                                                   : QString());
     m_countdown->setVisible(!m_countdown->text().isEmpty());
-    m_failure->setVisible(!m_page.done && (!m_page.Label1.text.isEmpty() || m_page.Label4Reason.visible));
+    const bool told = !m_page.Label1.text.isEmpty() || m_page.Label4Reason.visible;
+    m_failure->setVisible(told && m_page.failed);
+    m_trouble->setVisible(told && m_page.sending);
+    m_troubleLine->setText(m_page.Label1.text);
+    m_troubleLine->setVisible(!m_page.Label1.text.isEmpty());
+    m_troubleReason->setText(isolated(m_page.Label4Reason.text));
+    m_troubleReason->setVisible(m_page.Label4Reason.visible);
     m_orderHead->setText(wording(u"ההזמנה שלך"_s, u"Your order"_s));
-    // Folder names hold underscores and no blanks: they may break behind one.
-    m_orderName->setText(QChar(0x2066) + QString(m_page.Label15.text).replace(u'_', u"_\u200B"_s) + QChar(0x2069));
-    m_orderName->setVisible(!m_page.Label15.text.isEmpty());
+    m_orderName->setText(orderNameLine(m_page.Label15.text, state().english()));
     m_left->setText(isolated(m_page.Label4Notru.text.trimmed() + u": "_s + m_page.Label12.text));
     m_left->setVisible(!m_page.Label12.text.isEmpty() && !m_page.done);
     const QString phone = m_page.Label10.text.trimmed();
-    m_phone->setText(isolated(wording(u"טלפון החנות: %1"_s, u"The shop's telephone: %1"_s).arg(phone)));
+    const QString phoneLine = isolated(wording(u"טלפון החנות: %1"_s, u"The shop's telephone: %1"_s).arg(phone));
+    m_phone->setText(phoneLine);
     m_phone->setVisible(!phone.isEmpty());
+    m_order->setVisible(!m_page.Label15.text.isEmpty() && !m_page.Picture6.visible);
     m_end->setVisible(m_page.Picture6.visible);
+    m_endName->setText(orderNameLine(m_page.Label16.text, state().english()));
+    m_endPhone->setText(phoneLine);
+    m_endPhone->setVisible(!phone.isEmpty());
     m_stop->setVisible(counting);
     m_refresh->setVisible(!m_page.sending && (waiting || m_page.failed));
+    m_close->setVisible(m_page.done || (m_page.failed && !m_page.Image5.visible));
     // While files travel nothing is chosen; afterwards the main action is.
-    QWidget* main = m_page.Image5.visible ? static_cast<QWidget*>(m_again)
-                    : waiting             ? m_goOn
-                    : counting            ? m_stop
-                                          : static_cast<QWidget*>(this);
+    QWidget* main = m_page.Image5.visible        ? static_cast<QWidget*>(m_again)
+                    : waiting                    ? m_goOn
+                    : counting                   ? m_stop
+                    : m_close->isVisibleTo(this) ? m_close
+                                                 : static_cast<QWidget*>(this);
     if (std::exchange(m_main, main) != main)
         main->setFocus(Qt::OtherFocusReason);
 }

@@ -123,7 +123,7 @@ TEST(ServerListTest, AListMustNameTheFolderAndATotalAndNoWhereSayNot) {
         {QString(), ServerVerdict::NotVerified},
     };
     for (const auto& c : cases)
-        EXPECT_EQ(JudgeServerList(c.answer, folder), c.verdict) << c.answer.toStdString();
+        EXPECT_EQ(ReadServerAnswer(c.answer, folder).verdict, c.verdict) << c.answer.toStdString();
     EXPECT_EQ(ListFileName(0), QStringLiteral("filelisthom.txt"));
     EXPECT_EQ(ListFileName(3), QStringLiteral("filelisthom3.txt"));
     EXPECT_EQ(ListFileName(4), QString());
