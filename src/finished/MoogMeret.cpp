@@ -98,8 +98,9 @@ void MoogMeret::Command5_Click() {
     }
     Picture2.visible = false;
     Picture1 = {};
-    m_walked = false;
+    leaveWalk();
     Label4Rek.visible = List3.isEmpty();
+    Label4Bhar.visible = !List3.isEmpty();
     showSendButtons(true);
     Q_EMIT changed();
 }
@@ -121,6 +122,7 @@ void MoogMeret::List3_Click(int index) {
     List2.setCurrentIndex(index);
     const QString folder = List2.currentItem();
     Picture2.visible = true;
+    Label4Bhar.visible = false;
     m_state.transfer.OrderFolder = folder;
     // Neither is set back by a later folder: the lab's people may send what an order in pieces came from.
     if (TravelsInPieces(List3.currentItem())) {
@@ -128,7 +130,7 @@ void MoogMeret::List3_Click(int index) {
         File1.setPattern(FilesToSend::withPieces);
     }
     File1.setFolder(folder);
-    m_walked = false;
+    leaveWalk();
     showOrder(folder);
     loadPreview();
     showSendButtons(true);
@@ -140,7 +142,9 @@ void MoogMeret::showOrder(const QString& folder) {
     Label4Reka.visible = File1.names().isEmpty();
     Label4Pieces.visible = m_state.transfer.Mefurak > 0;
     const OrderDetails details = detailsOf(folder);
-    Label4Lakoach.text = QStringList{details.n1, details.n2}.join(u' ').trimmed();
+    Label4Lakoach.text = m_state.wording(QStringLiteral("לקוח: %1 %2"), QStringLiteral("Customer: %1 %2"))
+                             .arg(details.n1, details.n2)
+                             .trimmed();
 }
 
 // A first file that is no picture, as a print file or a piece, leaves the window empty.

@@ -63,9 +63,10 @@ public:
     Caption Label4Shalav1;
     TextList Dir1; // folders below the folder that Dir1 is at
     QString Dir1Path;
-    TextList List2;    // full paths of the order folders
-    TextList List3;    // their leaf names
-    Caption Label4Rek; // shown when there is no order at all
+    TextList List2;     // full paths of the order folders
+    TextList List3;     // their leaf names
+    Caption Label4Rek;  // shown when there is no order at all
+    Caption Label4Bhar; // shown while none is picked
     Caption Command5;
 
     Caption Picture2; // step two: the files of the chosen order, the yellow window
@@ -141,6 +142,7 @@ private:
     void selectPackage(int index);
     void sendPackage(int index);
     void endWalk();
+    void leaveWalk();
     void showWalk();
     void showOutcome();
     bool mailSetUp() const;

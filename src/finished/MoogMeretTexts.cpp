@@ -12,6 +12,8 @@ void MoogMeret::setTexts() {
     set(Label4Shalav1, QStringLiteral("שלב ראשון: איזו הזמנה לשלוח?"), QStringLiteral("Step one: which order?"));
     set(Label4Rek, QStringLiteral("אין במחשב זה הזמנות מוגמרות."),
         QStringLiteral("There are no finished orders on this computer."));
+    set(Label4Bhar, QStringLiteral("נגיעה בהזמנה מציגה את הקבצים שלה."),
+        QStringLiteral("Touch an order to see its files."));
     set(Label4Shalav2, QStringLiteral("שלב שני: אילו קבצים לשלוח? נגיעה בשורה מסמנת קובץ או מבטלת סימון."),
         QStringLiteral("Step two: which files? A touch marks a file, or takes its mark away."));
     set(Label4Files, QStringLiteral("קבצים בהזמנה"), QStringLiteral("files in this order"));
@@ -37,7 +39,7 @@ void MoogMeret::setTexts() {
     set(Label2, QStringLiteral("התמונות ארוזות למשלוח והן תשלחנה ב"),
         QStringLiteral("The pictures are packed for sending and will go in"));
     set(Label3, QStringLiteral("מנות"), QStringLiteral("packages"));
-    set(Label4Dakot, QStringLiteral("דקות במנה זו"), QStringLiteral("minutes on this package"));
+    set(Label4Dakot, QStringLiteral("דקות במנה זו:"), QStringLiteral("Minutes on this package:"));
     set(Label24, QStringLiteral("לחצן יציאה יהיה פעיל לאחר משלוח כל המנות"),
         QStringLiteral("The exit button will work after all the packages are sent"));
     showWalk();

@@ -124,6 +124,11 @@ void MoogMeret::endWalk() {
     Q_EMIT changed();
 }
 
+void MoogMeret::leaveWalk() {
+    m_walked = false;
+    Command18.visible = Command4Orders.visible = false;
+}
+
 void MoogMeret::Label13_Click() {
     m_walk.clearMinutes();
     showWalk();
@@ -170,8 +175,7 @@ void MoogMeret::sendPackage(int index) {
         outcome = {MailEnd::AttachmentMissing, path};
     m_sending = false;
     m_packages[at] = outcome.end == MailEnd::Sent ? Package::Sent : Package::Failed;
-    Label4Doar.text = LeafName(path) + QStringLiteral(": ") +
-                      MailResultText(MailResultCode(outcome.end), m_state.english()).trimmed();
+    Label4Doar.text = MailResultText(MailResultCode(outcome.end), m_state.english()).trimmed();
     Label4Doar.hint = outcome.words;
     if (!m_walking)
         showOutcome();

@@ -68,6 +68,9 @@ QWidget* FtpFrmView::makeProgress() {
     m_minutesTitle->setWordWrap(false);
     minutes->addWidget(m_minutesTitle);
     minutes->addWidget(label(u"Label4Diff"_s, m_page.Label4Diff, "strong"));
+    m_minutesUnit = makeLabel(box, "muted");
+    m_minutesUnit->setWordWrap(false);
+    minutes->addWidget(m_minutesUnit);
     minutes->addStretch(1);
     m_pieces = new QProgressBar(box);
     m_pieces->setRange(0, FtpBoard::Pic4ProgWidth);
@@ -313,7 +316,10 @@ void FtpFrmView::render() {
     m_pieces->setVisible(inPieces);
     m_pieces->setValue(m_page.PicInProgKatanWidth);
     m_pieces->setAccessibleName(wording(u"חלקי ההזמנה"_s, u"Pieces of the order"_s));
-    m_minutesTitle->setVisible(m_page.Label4DiffTitle.visible && !m_page.Label4Diff.text.isEmpty());
+    const bool minutesKnown = m_page.Label4DiffTitle.visible && !m_page.Label4Diff.text.isEmpty();
+    m_minutesTitle->setVisible(minutesKnown);
+    m_minutesUnit->setVisible(minutesKnown);
+    m_minutesUnit->setText(wording(u"דקות"_s, u"minutes"_s));
 
     m_failure->setVisible(failed && (m_page.Picture6.visible || m_page.Label4Reason.visible));
     const auto join = [](std::initializer_list<const Caption*> parts) {

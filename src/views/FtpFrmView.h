@@ -34,6 +34,7 @@ private:
     Gauge* m_gauge = nullptr;
     QProgressBar* m_pieces = nullptr;
     QLabel* m_minutesTitle = nullptr;
+    QLabel* m_minutesUnit = nullptr;
     QFrame* m_failure = nullptr;
     QLabel* m_failureLine = nullptr;
     QLabel* m_successLine = nullptr;

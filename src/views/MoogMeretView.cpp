@@ -10,6 +10,8 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -47,6 +49,7 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
     auto* row = new QHBoxLayout;
     row->setSpacing(theme.px(16));
     row->addWidget(makeOrders(), 4);
+    row->addWidget(makeHint(), 8);
     row->addWidget(makeFiles(), 5);
     row->addWidget(makeWalk(), 9);
     row->addWidget(makeWays());
@@ -60,17 +63,15 @@ QString MoogMeretView::orderRow(const QString& folderName) const {
     const auto order = FinishedOrderOf(folderName);
     if (!order)
         return folderName;
-    const QString row =
-        wording(u"הזמנה %1   %2"_s, u"Order %1   %2"_s).arg(order->number, order->date.toString(u"dd.MM.yyyy"_s));
-    return order->pieces ? row + wording(u"   בחלקים"_s, u"   in pieces"_s) : row;
+    return wording(u"מס' %1   %2"_s, u"No. %1   %2"_s).arg(order->number, order->date.toString(u"dd.MM.yyyy"_s));
 }
 
 QWidget* MoogMeretView::makeOrders() {
     const auto [card, column] = makeCard(theme(), this, "card");
     m_ordersCard = card;
     column->addWidget(label(u"Label4Shalav1"_s, m_page.Label4Shalav1, "strong"));
-    column->addWidget(label(u"Label4Rek"_s, m_page.Label4Rek, "muted"));
     m_orders = new QListWidget(card);
+    m_orders->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     whenPicked(m_orders, [&page = m_page](int row) { page.List3_Click(row); });
     bindList(u"List3"_s, m_page.List3, m_orders, [this](const QString& name) { return orderRow(name); });
     column->addWidget(m_orders, 1);
@@ -80,6 +81,24 @@ QWidget* MoogMeretView::makeOrders() {
         u"Command4Pieces"_s, m_page.Command4Pieces, Role::Plain, [this] { m_page.Command4Pieces_Click(); },
         u"layers"_s));
     return card;
+}
+
+// What stands in the place of the files until there are any to show.
+QWidget* MoogMeretView::makeHint() {
+    m_hint = new QWidget(this);
+    auto* column = new QVBoxLayout(m_hint);
+    column->setSpacing(theme().px(14));
+    column->addStretch(1);
+    auto* sign = new QLabel(m_hint);
+    sign->setPixmap(theme().icon(u"pictures"_s, theme().px(96), Theme::Colour::Edge));
+    column->addWidget(sign, 0, Qt::AlignCenter);
+    for (QLabel* text :
+         {label(u"Label4Rek"_s, m_page.Label4Rek, "large"), label(u"Label4Bhar"_s, m_page.Label4Bhar, "large")}) {
+        text->setAlignment(Qt::AlignCenter);
+        column->addWidget(text);
+    }
+    column->addStretch(1);
+    return m_hint;
 }
 
 QWidget* MoogMeretView::makeFiles() {
@@ -120,6 +139,10 @@ QWidget* MoogMeretView::makeWays() {
     bind(u"Picture1"_s, m_preview,
          [this] { return u"%1 x %2"_s.arg(m_page.Picture1.width()).arg(m_page.Picture1.height()); });
     column->addWidget(m_preview);
+    m_end = new Gauge(theme(), m_ways);
+    m_end->setFixedSize(theme().px(180), theme().px(180));
+    column->addStretch(1);
+    column->addWidget(m_end, 0, Qt::AlignCenter);
     column->addStretch(1);
     m_pickFirst = label(u"Label4Shalav3"_s, m_page.Label4Shalav3, "strong");
     column->addWidget(m_pickFirst);
@@ -145,8 +168,8 @@ QWidget* MoogMeretView::makeWalk() {
     };
     m_gauge = new Gauge(theme(), m_walk);
     column->addWidget(m_gauge, 3, Qt::AlignCenter);
-    centred(label(u"Label4Mana"_s, m_page.Label4Mana, "title"));
-    centred(label(u"Label4Shem"_s, m_page.Label4Shem, "muted"));
+    m_inHand = centred(label(u"Label4Mana"_s, m_page.Label4Mana, "large"));
+    m_nameInHand = centred(label(u"Label4Shem"_s, m_page.Label4Shem, "muted"));
     m_parts = centred(makeLabel(m_walk, "body"));
     m_minutes = button(
         u"Label13"_s, m_page.Label13, Role::Plain, [this] { m_page.Label13_Click(); }, u"clock"_s);
@@ -182,7 +205,8 @@ void MoogMeretView::makeBars() {
         u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }, u"home"_s));
     frame().addSecondaryAction(
         button(u"Command18"_s, m_page.Command18, Role::Secondary, [this] { m_page.Command18_Click(); }));
-    frame().addStatus(label(u"Label4Shaa"_s, m_page.Label4Shaa, "large"));
+    m_time = label(u"Label4Shaa"_s, m_page.Label4Shaa, "large");
+    frame().addStatus(m_time);
     frame().addMainAction(
         button(u"Command4Orders"_s, m_page.Command4Orders, Role::Main, [this] { m_page.Command4Orders_Click(); }));
     frame().addMainAction(button(
@@ -211,15 +235,25 @@ void MoogMeretView::render() {
     const bool picked = m_page.Picture2.visible && !walk;
     frame().setTitle(m_page.Title.text, m_page.Label23.text);
     m_ordersCard->setVisible(m_page.Picture3.visible && !walk);
-    m_orders->setVisible(!m_page.Label4Rek.visible);
+    m_hint->setVisible(!m_page.Picture2.visible && !walk);
     m_files->setVisible(picked);
     m_walk->setVisible(walk);
     m_ways->setVisible(picked || (walk && !m_page.walking()));
     m_preview->setVisible(picked);
     m_pickFirst->setVisible(picked);
+    m_end->setVisible(walk);
+    m_time->setVisible(walk);
     if (m_page.List3.currentIndex() < 0 && m_orders->count() > 0)
         m_orders->scrollToBottom(); // the latest order
     m_orders->setAccessibleName(m_page.Label4Shalav1.text);
+    const int size = theme().px(24);
+    m_orders->setIconSize({size, size});
+    for (int row = 0; row < m_orders->count(); ++row) {
+        QListWidgetItem* item = m_orders->item(row);
+        const bool inPieces = TravelsInPieces(m_page.List3.item(row));
+        item->setIcon(theme().icon(inPieces ? u"layers"_s : u"pictures"_s, size, Theme::Colour::Primary));
+        item->setToolTip(inPieces ? m_page.Label4Pieces.text : QString());
+    }
     if (picked)
         renderFiles();
     if (walk)
@@ -230,6 +264,7 @@ void MoogMeretView::renderFiles() {
     for (int row = 0; row < m_fileList->count(); ++row) {
         QListWidgetItem* item = m_fileList->item(row);
         item->setFlags(item->flags() & ~Qt::ItemIsUserCheckable); // the page turns the mark over
+        item->setFont(theme().font(Theme::Type::Small));          // a name says much, and its end most
         item->setCheckState(m_page.File1.isMarked(row) ? Qt::Checked : Qt::Unchecked);
     }
     m_fileList->setAccessibleName(m_page.Label4Shalav2.text);
@@ -248,12 +283,20 @@ void MoogMeretView::renderWalk() {
     for (int i = 0; i < count; ++i)
         failed = failed || m_page.package(i) == MoogMeret::Package::Failed;
     m_gauge->setVisible(walking);
-    m_gauge->show(count == 0 ? 0 : double(index) / count, u"%1 / %2"_s.arg(index + 1).arg(count), m_page.Label3.text);
+    const double ofPackage = std::min(m_page.Label13.text.toInt(), 3) / 3.0;
+    m_gauge->show(count == 0 ? 0 : (index + ofPackage) / count, u"%1 / %2"_s.arg(index + 1).arg(count),
+                  m_page.Label3.text);
+    if (m_page.Label4Sof.text.isEmpty())
+        m_end->show(1, QString::number(count), m_page.Label3.text);
+    else
+        m_end->showSign(failed ? Gauge::Mood::Bad : Gauge::Mood::Good);
+    m_inHand->setVisible(walking);
+    m_nameInHand->setVisible(walking);
     m_parts->setVisible(walking);
     m_parts->setText(isolated(m_page.Label9.text + u'\n' + m_page.Label2.text + u' ' + QString::number(count) + u' ' +
                               m_page.Label3.text));
     m_minutes->setVisible(walking);
-    m_minutes->setText(m_page.Label13.text + u' ' + m_page.Label4Dakot.text);
+    m_minutes->setText(m_page.Label4Dakot.text + u' ' + m_page.Label13.text);
     speak(m_minutes, m_minutes->text());
 
     const bool sending = m_page.sending();

@@ -22,6 +22,7 @@ protected:
 
 private:
     QWidget* makeOrders();
+    QWidget* makeHint();
     QWidget* makeFiles();
     QWidget* makeWays();
     QWidget* makeWalk();
@@ -34,6 +35,7 @@ private:
     MoogMeret& m_page;
     QWidget* m_ordersCard = nullptr;
     QListWidget* m_orders = nullptr;
+    QWidget* m_hint = nullptr;
     QFrame* m_files = nullptr;
     QListWidget* m_fileList = nullptr;
     QLabel* m_counts = nullptr;
@@ -42,6 +44,10 @@ private:
     ScrolledPicture* m_preview = nullptr;
     QWidget* m_walk = nullptr;
     Gauge* m_gauge = nullptr;
+    Gauge* m_end = nullptr;
+    QLabel* m_inHand = nullptr;
+    QLabel* m_nameInHand = nullptr;
+    QLabel* m_time = nullptr;
     QLabel* m_parts = nullptr;
     QPushButton* m_minutes = nullptr;
     QFrame* m_answer = nullptr;

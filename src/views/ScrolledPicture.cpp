@@ -20,6 +20,7 @@ ScrolledPicture::ScrolledPicture(const Theme& theme, QWidget* parent, QSize wind
     setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     setFixedSize(theme.px(window.width()) + verticalScrollBar()->sizeHint().width(),
                  theme.px(window.height()) + horizontalScrollBar()->sizeHint().height());
+    setCornerWidget(new QWidget(this));
     connect(horizontalScrollBar(), &QScrollBar::valueChanged, this, &ScrolledPicture::movedAcross);
     connect(verticalScrollBar(), &QScrollBar::valueChanged, this, &ScrolledPicture::movedDown);
 }
@@ -46,6 +47,12 @@ void ScrolledPicture::paintEvent(QPaintEvent*) {
     QPainter painter(viewport());
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     painter.fillRect(viewport()->rect(), Theme::Colour::Sunken);
+    paintPicture(painter);
+    painter.setPen(Theme::Colour::Line);
+    painter.drawRect(viewport()->rect().adjusted(0, 0, -1, -1));
+}
+
+void ScrolledPicture::paintPicture(QPainter& painter) const {
     if (m_picture.isNull()) {
         const int size = m_theme.px(64);
         painter.drawPixmap((viewport()->width() - size) / 2, (viewport()->height() - size) / 2,

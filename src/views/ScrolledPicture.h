@@ -28,6 +28,8 @@ protected:
     void mouseMoveEvent(QMouseEvent* event) override;
 
 private:
+    void paintPicture(QPainter& painter) const;
+
     const Theme& m_theme;
     int m_step;
     QImage m_picture;

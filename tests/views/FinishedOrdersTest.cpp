@@ -63,6 +63,8 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     MailAccount& mail = walk.program().state().profile.mail;
     mail.host = u"127.0.0.1"_s;
     mail.port = 9;
+    mail.from = u"kiosk@example.com"_s;
+    mail.to = u"lab@example.com"_s;
     mail.encryption = MailEncryption::None;
     look(walk, u"60-no-orders"_s);
     const QString pieces = makeOrders(walk);
