@@ -11,6 +11,7 @@
 #include "entry/Havharot.h"
 #include "entry/nnn.h"
 #include "finished/MoogMeret.h"
+#include "finished/SpltForm.h"
 #include "platform/Platform.h"
 #include "selection/kyoskNew.h"
 #include "session/PageChain.h"
@@ -26,6 +27,7 @@
 #include "views/MainWindow.h"
 #include "views/MoogMeretView.h"
 #include "views/RedIView.h"
+#include "views/SpltFormView.h"
 #include "views/UploadFormView.h"
 #include "views/hatchalaView.h"
 #include "views/kyoskNewView.h"
@@ -53,6 +55,7 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
     chain.registerPage(PageId::UploadForm, [&] { return std::make_unique<UploadForm>(state, platform, chain); });
     chain.registerPage(PageId::MoogMeret, [&] { return std::make_unique<MoogMeret>(state, platform, chain); });
     chain.registerPage(PageId::InetForm, [&] { return std::make_unique<InetForm>(state, platform, chain); });
+    chain.registerPage(PageId::SpltForm, [&] { return std::make_unique<SpltForm>(state, platform, chain); });
 }
 
 void registerViews(MainWindow& window, PageChain& chain, SessionState& state, const Files& files) {
@@ -95,6 +98,9 @@ void registerViews(MainWindow& window, PageChain& chain, SessionState& state, co
     });
     window.registerView(PageId::MoogMeret, [&](Page& page, const Theme& theme) {
         return std::make_unique<MoogMeretView>(static_cast<MoogMeret&>(page), state, theme);
+    });
+    window.registerView(PageId::SpltForm, [&](Page& page, const Theme& theme) {
+        return std::make_unique<SpltFormView>(static_cast<SpltForm&>(page), state, theme);
     });
 }
 

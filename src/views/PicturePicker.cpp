@@ -291,8 +291,8 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
     add(m_state.wording(u"הורדות"_s, u"Downloads"_s), u"folder"_s, standard(QStandardPaths::DownloadLocation));
     add(m_state.wording(u"תיקיית הבית"_s, u"Home folder"_s), u"home"_s, standard(QStandardPaths::HomeLocation));
     if (const auto initial = m_files.drives().toHost(initialFolder))
-        add(everyFile() ? toText(initial->filename()) : initialFolder.left(2), everyFile() ? u"folder"_s : u"drive"_s,
-            *initial);
+        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : initialFolder.left(2),
+            everyFile() ? u"folder"_s : u"drive"_s, *initial);
     for (const Drives::Drive& drive : drives)
         addDrive(drive);
     if (result.empty())

@@ -139,6 +139,7 @@ QPushButton[role="tool"] { padding: 0; min-width: 44px; min-height: 44px; border
 QPushButton[role="round"] { padding: 0; min-width: %keypx; min-height: %keypx; border-radius: %halfKeypx; }
 QPushButton[role="done"] { border: none; background: $Primary; color: white; padding: 0 @26px; }
 QPushButton[role="done"]:hover, QPushButton[role="done"]:pressed { background: $PrimaryDark; }
+QPushButton[role="done"]:disabled { background: $Sunken; color: $Muted; }
 QPushButton[role="key"], QPushButton[role="wordKey"] { padding: 0; min-width: @32px; min-height: %keypx;
   border: 1px solid $Line; border-bottom: 2px solid $Edge; border-radius: @10px; font-size: @22px; font-weight: normal; }
 QPushButton[role="wordKey"] { font-size: @16px; font-weight: bold; }
@@ -163,6 +164,8 @@ QComboBox QAbstractItemView { border: 1px solid $Edge; background: $Surface; out
   selection-background-color: $PrimarySoft; selection-color: $Ink; }
 QComboBox QAbstractItemView::item, QListWidget::item { min-height: %targetpx; padding: 0 @12px; border-radius: @8px; }
 QListWidget { border: 1px solid $Line; border-radius: @14px; background: $Surface; padding: @6px; outline: none; }
+QListWidget[dense="true"] { font-size: @15px; }
+QListWidget[dense="true"]::item { min-height: @30px; padding: 0 @8px; }
 QListWidget::item:selected { background: $PrimarySoft; color: $Ink; }
 
 QCheckBox { min-height: %targetpx; spacing: @12px; background: transparent; }

@@ -1,0 +1,86 @@
+#include "PageLook.h"
+
+#include "finished/SpltForm.h"
+#include "platform/Files.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "views/MainWindow.h"
+#include "views/ScreenDialogs.h"
+
+#include <gtest/gtest.h>
+
+#include <QTest>
+#include <QTimer>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+class PiecesLook : public PageLook {};
+
+// An order folder is cut, a piece is lost, and what is left is joined: by pressing what the operator sees.
+TEST_P(PiecesLook, ThePageOfPieces) {
+    Walk walk(GetParam().size, u"[Switches]\nSplitPage = yes\n"_s);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    EXPECT_TRUE(walk.program().state().SplitPage);
+    const Files& files = walk.program().platform().files;
+    const QString order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_s;
+    for (const QString& folder : {u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s, order})
+        ASSERT_TRUE(files.makeFolder(folder).ok());
+    for (int i = 1; i <= 6; ++i)
+        ASSERT_TRUE(
+            files.writeWhole(order + u"\\0%1 1015GNB000%1_03AABB.jpp"_s.arg(i), QByteArray(i * 270000, 'x')).ok());
+    ASSERT_TRUE(files.writeWhole(order + u"\\2026_11_21_KUP_1234^105.txt"_s, "the order").ok());
+
+    walk.program().chain().show(PageId::SpltForm);
+    walk.waitFor(u"SpltForm"_s);
+    look(walk, u"70-pieces-start"_s);
+    QTimer::singleShot(400, &walk.program().window(), [&] {
+        look(walk, u"71-pieces-picker"_s);
+        QWidget* cancel = walk.program().window().findChild<QWidget*>(u"pickerCancel"_s);
+        ASSERT_TRUE(cancel);
+        QMetaObject::invokeMethod(cancel, "click");
+    });
+    walk.press(u"SpltForm"_s, u"Command2"_s);
+    const auto pick = [&](const QString& button, const QString& path) {
+        walk.program().dialogs().nextPick = [path] { return path; };
+        walk.press(u"SpltForm"_s, button);
+    };
+    pick(u"Command2"_s, order + u"\\2026_11_21_KUP_1234^105.txt"_s);
+    look(walk, u"72-pieces-to-cut"_s);
+    walk.press(u"SpltForm"_s, u"Command3"_s);
+    look(walk, u"73-pieces-cut"_s);
+    walk.type(u"SpltForm"_s, u"Text2"_s, u"none"_s);
+    walk.press(u"SpltForm"_s, u"Command3"_s);
+    look(walk, u"74-pieces-wrong-size"_s);
+    walk.program().dialogs().closeMessages();
+
+    const QString pieces = order + u"\\meforakim"_s;
+    ASSERT_TRUE(files.removeFile(pieces + u"\\02 1015GNB0002_03AABB_jpp_001_002.prk"_s).ok());
+    pick(u"Command8"_s, pieces + u"\\01 1015GNB0001_03AABB_jpp_001_001.prk"_s);
+    auto& page = walk.page<SpltForm>(PageId::SpltForm);
+    ASSERT_EQ(page.List4Bodedim.count(), 6);
+    const ControlFinder finder(walk.program().window());
+    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"List4Bodedim"_s, page.List4Bodedim.item(2)).ok());
+    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"ListChalakim"_s, page.ListChalakim.item(3)).ok());
+    walk.press(u"SpltForm"_s, u"Command6"_s);
+    EXPECT_EQ(page.List4Bodedim.currentIndex(), 2);
+    EXPECT_EQ(page.Label8.text, QString::number(*files.size(page.ListChalakim.item(3))));
+    look(walk, u"75-pieces-families"_s);
+    page.busy = true;
+    page.percent = 42;
+    page.Label4Work.text = u"3 / 6: 03 1015GNB0003_03AABB_jpp_001_003.prk"_s;
+    page.Command15.visible = true;
+    changed(page, walk);
+    look(walk, u"76-pieces-busy"_s);
+    page.busy = page.Command15.visible = false;
+    walk.press(u"SpltForm"_s, u"Command1"_s);
+    look(walk, u"77-pieces-joined"_s);
+    EXPECT_EQ(files.names(pieces + u"\\moorkavim"_s, u"*"_s).size(), 5);
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, PiecesLook, PageLook::screens());
+
+} // namespace lumora
