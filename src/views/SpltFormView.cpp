@@ -53,6 +53,7 @@ QListWidget* SpltFormView::makeList(QVBoxLayout& column, const QString& name, co
     auto* title = makeLabel(this, "smallMuted");
     auto* widget = new QListWidget(this);
     widget->setTextElideMode(Qt::ElideMiddle);
+    widget->setProperty("names", true);
     widget->setLayoutDirection(Qt::LeftToRight); // names of files, whose middle may be left out
     widget->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     widget->setUniformItemSizes(true);
@@ -138,14 +139,15 @@ QWidget* SpltFormView::makeJoin() {
     m_families = makeList(*left, u"List4Bodedim"_s, m_page.List4Bodedim, u"משפחות"_s, u"Families"_s, 1,
                           &SpltForm::List4Bodedim_Click);
     m_families->unsetLayoutDirection();
-    lists->addLayout(left, 4);
+    m_families->setProperty("names", false);
+    lists->addLayout(left, 1);
     auto* right = new QVBoxLayout;
     right->setSpacing(theme().px(6));
     makeList(*right, u"List4Famely"_s, m_page.List4Famely, u"חלקי המשפחה שנבחרה"_s, u"Pieces of the chosen family"_s,
              2);
     makeList(*right, u"ListChalakim"_s, m_page.ListChalakim, u"כל הקבצים שנקראו"_s, u"All the files read"_s, 3,
              &SpltForm::ListChalakim_Click);
-    lists->addLayout(right, 3);
+    lists->addLayout(right, 1);
     m_length = makeLabel(card, "smallMuted");
     m_length->setWordWrap(false);
     m_length->setAlignment(Qt::AlignTrailing | Qt::AlignVCenter);

@@ -164,7 +164,7 @@ QComboBox QAbstractItemView { border: 1px solid $Edge; background: $Surface; out
   selection-background-color: $PrimarySoft; selection-color: $Ink; }
 QComboBox QAbstractItemView::item, QListWidget::item { min-height: %targetpx; padding: 0 @12px; border-radius: @8px; }
 QListWidget { border: 1px solid $Line; border-radius: @14px; background: $Surface; padding: @6px; outline: none; }
-QListWidget[dense="true"] { font-size: @15px; }
+QListWidget[names="true"] { font-size: @14px; }
 QListWidget[dense="true"]::item { min-height: @30px; padding: 0 @8px; }
 QListWidget::item:selected { background: $PrimarySoft; color: $Ink; }
 

@@ -34,7 +34,9 @@ TEST_P(PiecesLook, ThePageOfPieces) {
             files.writeWhole(order + u"\\0%1 1015GNB000%1_03AABB.jpp"_s.arg(i), QByteArray(i * 270000, 'x')).ok());
     ASSERT_TRUE(files.writeWhole(order + u"\\2026_11_21_KUP_1234^105.txt"_s, "the order").ok());
 
-    walk.program().chain().show(PageId::SpltForm);
+    walk.program().chain().show(PageId::MoogMeret);
+    walk.waitFor(u"MoogMeret"_s);
+    walk.press(u"MoogMeret"_s, u"Command4Pieces"_s);
     walk.waitFor(u"SpltForm"_s);
     look(walk, u"70-pieces-start"_s);
     QTimer::singleShot(400, &walk.program().window(), [&] {
@@ -79,6 +81,8 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     walk.press(u"SpltForm"_s, u"Command1"_s);
     look(walk, u"77-pieces-joined"_s);
     EXPECT_EQ(files.names(pieces + u"\\moorkavim"_s, u"*"_s).size(), 5);
+    walk.press(u"SpltForm"_s, u"Image3"_s);
+    walk.waitFor(u"MoogMeret"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, PiecesLook, PageLook::screens());
