@@ -12,12 +12,14 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST_F(PreparingAnEditedOrder, writesTheLogThatTheLabExpectsToTheByte) {
     const QString newPicture = EditRecord::newPicture();
-    givePicture(QStringLiteral("IMG_0012.jpg"));
-    giveFile(QStringLiteral("IMG_0013.jpg"), "no picture");
-    prepare({edited(QStringLiteral("C:\\pics\\IMG_0012.jpg"), newPicture, QStringLiteral("12")),
-             edited(QStringLiteral("C:\\pics\\IMG_0013.jpg"), newPicture)});
+    givePicture(u"IMG_0012.jpg"_s);
+    giveFile(u"IMG_0013.jpg"_s, "no picture");
+    prepare(
+        {edited(u"C:\\pics\\IMG_0012.jpg"_s, newPicture, u"12"_s), edited(u"C:\\pics\\IMG_0013.jpg"_s, newPicture)});
 
     const Result<QByteArray> log = machine.files.read(logPath());
     ASSERT_TRUE(log);
@@ -30,22 +32,21 @@ TEST_F(PreparingAnEditedOrder, writesTheLogThatTheLabExpectsToTheByte) {
 TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     state.SugTzad = 60;
     state.transfer.HazmanaP = 1;
-    const QString portrait = givePicture(QStringLiteral("תמונה 01.jpg"), 300, 400, Qt::darkCyan);
-    const QString other = givePicture(QStringLiteral("small.JPG"));
-    const QString edits = record({{EditRecord::GainR, QStringLiteral("1.3")},
-                                  {EditRecord::RotationCode, QStringLiteral("195")},
-                                  {EditRecord::ZoomPercent, QStringLiteral("80")},
-                                  {EditRecord::TextOn, QStringLiteral("1")},
-                                  {EditRecord::TextX, QStringLiteral("40")},
-                                  {EditRecord::TextY, QStringLiteral("50")},
-                                  {EditRecord::TextBody, QStringLiteral("שלום \"2026\"")}});
-    prepare({edited(portrait, edits, QStringLiteral("12")), edited(other)});
+    const QString portrait = givePicture(u"תמונה 01.jpg"_s, 300, 400, Qt::darkCyan);
+    const QString other = givePicture(u"small.JPG"_s);
+    const QString edits = record({{EditRecord::GainR, u"1.3"_s},
+                                  {EditRecord::RotationCode, u"195"_s},
+                                  {EditRecord::ZoomPercent, u"80"_s},
+                                  {EditRecord::TextOn, u"1"_s},
+                                  {EditRecord::TextX, u"40"_s},
+                                  {EditRecord::TextY, u"50"_s},
+                                  {EditRecord::TextBody, u"שלום \"2026\""_s}});
+    prepare({edited(portrait, edits, u"12"_s), edited(other)});
 
-    EXPECT_EQ(machine.files.names(folder(), QStringLiteral("*.*")),
-              QStringList({QStringLiteral("!105_1234.jpp"), QStringLiteral("1 1015GNB0001_02736D616C6C.jpp"),
-                           QStringLiteral("121015GNB0000_02FAEEE5F0E4203031.jpp"),
-                           QStringLiteral("2026_11_21_KUP_1234^105.txt")}));
-    const Result<PrintFileContent> content = unpacked(QStringLiteral("121015GNB0000_02FAEEE5F0E4203031.jpp"));
+    EXPECT_EQ(machine.files.names(folder(), u"*.*"_s),
+              QStringList({u"!105_1234.jpp"_s, u"1 1015GNB0001_02736D616C6C.jpp"_s,
+                           u"121015GNB0000_02FAEEE5F0E4203031.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s}));
+    const Result<PrintFileContent> content = unpacked(u"121015GNB0000_02FAEEE5F0E4203031.jpp"_s);
     ASSERT_TRUE(content);
     EXPECT_EQ(content->tail, "1 1 03-1234567Dana Levi 13 1051234      ") << "the short tail, whatever SugTzad says";
     EditFields fields;
@@ -55,15 +56,12 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     request.paper = {10, 15};
     EXPECT_EQ(content->picture, *renderEditedPrintToJpeg(request, fields));
 
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(folder() + QStringLiteral("\\!105_1234.jpp"))),
-              (PictureSize{450, 580}));
-    EXPECT_EQ(machine.files.names(jobFolder, QStringLiteral("*.*")),
-              QStringList({QStringLiteral("1 ~small.bmp"), QStringLiteral("12~תמונה 01.bmp")}));
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(jobFolder + QStringLiteral("\\12~תמונה 01.bmp"))),
-              (PictureSize{300, 450}));
-    EXPECT_FALSE(exists(QStringLiteral("C:\\2000lumora\\!!000\\^^^.jpg"))) << "goes at the end of each step";
-    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\vedron\\mispar.txt")), "106\r\n");
-    EXPECT_EQ(state.transfer.OrderLogBase + QStringLiteral(".txt"), logPath());
+    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{450, 580}));
+    EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
+    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(jobFolder + u"\\12~תמונה 01.bmp"_s)), (PictureSize{300, 450}));
+    EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_s)) << "goes at the end of each step";
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
+    EXPECT_EQ(state.transfer.OrderLogBase + u".txt"_s, logPath());
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
@@ -74,7 +72,7 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
 }
 
 TEST_F(PreparingAnEditedOrder, startsOnceByItselfTwoSecondsAfterItIsShown) {
-    B3& page = open({edited(givePicture(QStringLiteral("IMG_1.jpg")))});
+    B3& page = open({edited(givePicture(u"IMG_1.jpg"_s))});
     EXPECT_EQ(page.Timer2.interval(), 2000);
     page.Timer2.setInterval(1);
     for (const QDeadlineTimer limit(20000); front() != PageId::FtpFrm && !limit.hasExpired();)
@@ -90,15 +88,13 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
         const int level = 3 * (colour.red() + colour.green() + colour.blue()) / 10;
         return QColor(level, level, level);
     };
-    const QStringList paths = {givePicture(QStringLiteral("plain1.jpg"), 40, 30, first),
-                               givePicture(QStringLiteral("toned2.jpg"), 40, 30, second),
-                               givePicture(QStringLiteral("fixed3.jpg"), 40, 30, first),
-                               givePicture(QStringLiteral("both_4.jpg"), 40, 30, first),
-                               givePicture(QStringLiteral("toned5.jpg"), 40, 30, first),
-                               givePicture(QStringLiteral("sepia6.jpg"), 40, 30, first)};
+    const QStringList paths = {
+        givePicture(u"plain1.jpg"_s, 40, 30, first), givePicture(u"toned2.jpg"_s, 40, 30, second),
+        givePicture(u"fixed3.jpg"_s, 40, 30, first), givePicture(u"both_4.jpg"_s, 40, 30, first),
+        givePicture(u"toned5.jpg"_s, 40, 30, first), givePicture(u"sepia6.jpg"_s, 40, 30, first)};
     giveCorrected(paths[2], second);
     giveCorrected(paths[3], fixed);
-    const Changes sepia = toned + Changes{{EditRecord::GainB, QStringLiteral("0.5")}};
+    const Changes sepia = toned + Changes{{EditRecord::GainB, u"0.5"_s}};
     const QStringList failed =
         prepare({edited(paths[0]), edited(paths[1], record(toned)), edited(paths[2], record(redEyesCorrected)),
                  edited(paths[3], record(both)), edited(paths[4], record(toned)), edited(paths[5], record(sepia))});
@@ -118,29 +114,27 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     expectColour(copyOf(bw)->image(), {20, 15}, grey(first));
     ASSERT_TRUE(copyOf(correctedPath(bw)));
     expectColour(copyOf(correctedPath(bw))->image(), {20, 15}, grey(fixed));
-    EXPECT_EQ(machine.files.names(QStringLiteral("C:\\2000lumora"), QStringLiteral("*.bmp")),
-              QStringList(QStringLiteral("bw.bmp")));
+    EXPECT_EQ(machine.files.names(u"C:\\2000lumora"_s, u"*.bmp"_s), QStringList(u"bw.bmp"_s));
 }
 
 TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
-    const QString good = givePicture(QStringLiteral("toned1.jpg"), 40, 30, Qt::green);
-    const QString damaged = giveFile(QStringLiteral("damaged2.jpg"), "no picture");
-    const QString vanished = givePicture(QStringLiteral("vanished3.jpg"));
-    const QString both4 = givePicture(QStringLiteral("both4.jpg"));
-    const QString missing = QStringLiteral("C:\\pics\\missing5.jpg");
-    const QString unknown = QStringLiteral("C:\\pics\\????.jpg");
+    const QString good = givePicture(u"toned1.jpg"_s, 40, 30, Qt::green);
+    const QString damaged = giveFile(u"damaged2.jpg"_s, "no picture");
+    const QString vanished = givePicture(u"vanished3.jpg"_s);
+    const QString both4 = givePicture(u"both4.jpg"_s);
+    const QString missing = u"C:\\pics\\missing5.jpg"_s;
+    const QString unknown = u"C:\\pics\\????.jpg"_s;
     // What an earlier customer's order left behind.
     ASSERT_TRUE(Bitmap(40, 30, Qt::blue).image().save(hostText(bw), "BMP"));
     giveCorrected(bw, Qt::blue);
     makeFolder(folder().left(21));
-    giveFile(QStringLiteral("old.jpg"), *encodeJpeg(Bitmap(40, 30, Qt::blue), 90));
-    ASSERT_TRUE(
-        machine.files.copyFile(QStringLiteral("C:\\pics\\old.jpg"), QStringLiteral("C:\\2000lumora\\!!000\\^^^.jpg")));
+    giveFile(u"old.jpg"_s, *encodeJpeg(Bitmap(40, 30, Qt::blue), 90));
+    ASSERT_TRUE(machine.files.copyFile(u"C:\\pics\\old.jpg"_s, u"C:\\2000lumora\\!!000\\^^^.jpg"_s));
     const QStringList failed = prepare({edited(damaged, record(toned)), edited(good, record(toned)),
                                         edited(damaged, record(toned)), edited(vanished, record(redEyesCorrected)),
                                         edited(both4, record(both)), edited(missing), edited(unknown)});
     EXPECT_EQ(failed, QStringList({damaged, damaged, vanished, both4, missing, unknown}));
-    EXPECT_EQ(printFiles(), QStringList(QStringLiteral("1 1015GNB0001_02746F6E656431.jpp")))
+    EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0001_02746F6E656431.jpp"_s))
         << "failed pictures leave holes in the numbers";
     EXPECT_EQ(front(), PageId::FtpFrm) << "a failed picture never stops an order";
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << "the order's own files are all written";
@@ -150,7 +144,7 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
 TEST_F(PreparingAnEditedOrder, stretchesAPictureThatWasNeverOpenedToThePaper) {
     Bitmap halves(400, 100, Qt::blue);
     QPainter(&halves.image()).fillRect(0, 0, 200, 100, Qt::red);
-    const QString path = giveFile(QStringLiteral("halves.jpg"), *encodeJpeg(halves, 95));
+    const QString path = giveFile(u"halves.jpg"_s, *encodeJpeg(halves, 95));
     prepare({edited(path, EditRecord::newPicture())});
     const QImage paper = print(0);
     ASSERT_EQ(paper.size(), QSize(1500, 1000));
@@ -163,29 +157,29 @@ TEST_F(PreparingAnEditedOrder, stretchesAPictureThatWasNeverOpenedToThePaper) {
 }
 
 TEST_F(PreparingAnEditedOrder, skipsShortNamesInSilenceAndFailsWhatHasNoPaper) {
-    const QString tooShort = givePicture(QStringLiteral("ajpg"));
-    const QString good = givePicture(QStringLiteral("abcde.jpg"));
-    EXPECT_EQ(prepare({edited(tooShort, record(), QStringLiteral("5 ")), edited(good)}), QStringList());
-    EXPECT_EQ(printFiles(), QStringList(QStringLiteral("1 1015GNB0001_026162636465.jpp")));
+    const QString tooShort = givePicture(u"ajpg"_s);
+    const QString good = givePicture(u"abcde.jpg"_s);
+    EXPECT_EQ(prepare({edited(tooShort, record(), u"5 "_s), edited(good)}), QStringList());
+    EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0001_026162636465.jpp"_s));
     EXPECT_EQ(state.shemot.TotalPics, 6) << "skipped names count";
 
     chain.unload(PageId::FtpFrm);
-    state.MisparHazmana = QStringLiteral("106");
-    state.shemot.ppr = QStringLiteral("zz/zz");
+    state.MisparHazmana = u"106"_s;
+    state.shemot.ppr = u"zz/zz"_s;
     EXPECT_EQ(prepare({edited(good)}), QStringList(good));
-    EXPECT_TRUE(printFiles(QStringLiteral("106")).isEmpty());
+    EXPECT_TRUE(printFiles(u"106"_s).isEmpty());
 }
 
 TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
     // The second picture of the same name and copies takes the first one's thumbnail.
-    makeFolder(QStringLiteral("C:\\pics\\more"));
-    const QString red = givePicture(QStringLiteral("picture.jpg"), 40, 30, Qt::red);
-    const QString green = givePicture(QStringLiteral("more\\picture.jpg"), 40, 30, Qt::green);
-    const QString upright = givePicture(QStringLiteral("upright.jpg"), 30, 40, Qt::red);
-    const Changes turnedRed = {{EditRecord::GainR, QStringLiteral("0")}};
+    makeFolder(u"C:\\pics\\more"_s);
+    const QString red = givePicture(u"picture.jpg"_s, 40, 30, Qt::red);
+    const QString green = givePicture(u"more\\picture.jpg"_s, 40, 30, Qt::green);
+    const QString upright = givePicture(u"upright.jpg"_s, 30, 40, Qt::red);
+    const Changes turnedRed = {{EditRecord::GainR, u"0"_s}};
     prepare({edited(red), edited(green), edited(upright, record(turnedRed))});
     EXPECT_EQ(printFiles().size(), 3);
-    const QImage sheet = loadPicture(*machine.drives.toHost(folder() + QStringLiteral("\\!105_1234.jpp")))->image();
+    const QImage sheet = loadPicture(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s))->image();
     // Cells lie every 82 pixels from 5, the first row at 161; a thumbnail is 80 wide and 53 high, also an upright one.
     expectColour(sheet, {5 + 40, 161 + 26}, Qt::green);
     expectColour(sheet, {87 + 76, 161 + 26}, Qt::black);
@@ -202,8 +196,8 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
         PageId front;
         bool notice;
     };
-    const QString jpp = QStringLiteral("!%1_1234.jpp"), jpg = QStringLiteral("!%1_1234.jpg");
-    const QString picture = edited(givePicture(QStringLiteral("one_1.jpg")));
+    const QString jpp = u"!%1_1234.jpp"_s, jpg = u"!%1_1234.jpg"_s;
+    const QString picture = edited(givePicture(u"one_1.jpg"_s));
     int number = 200;
     for (const Case& c :
          {Case{0, false, {jpp}, false, PageId::FtpFrm, false}, Case{0, true, {jpg, jpp}, false, PageId::hatchala, true},
@@ -221,7 +215,7 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
         for (const QString& name : c.sheets)
             wanted += name.arg(number);
         const QString place = folder(state.MisparHazmana);
-        EXPECT_EQ(machine.files.names(place, QStringLiteral("!*")), wanted) << number;
+        EXPECT_EQ(machine.files.names(place, u"!*"_s), wanted) << number;
         EXPECT_EQ(checkOrderFolder(*machine.drives.toHost(place), {56, 30})->faults, QStringList());
         EXPECT_EQ(front(), c.front) << number;
         EXPECT_EQ(state.handOver.notice.contains(state.MisparHazmana), c.notice) << number;
@@ -233,16 +227,15 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
 TEST_F(PreparingAnEditedOrder, saysSoWhenThereIsNothingToPrepare) {
     B3& page = open({});
     page.Timer2_Tick();
-    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא נבחרו תמונות")));
+    EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
     EXPECT_FALSE(machine.files.folderExists(folder()));
-    EXPECT_FALSE(exists(QStringLiteral("C:\\vedron\\mispar.txt")));
+    EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_s));
     EXPECT_FALSE(page.preparing);
     EXPECT_TRUE(page.Command5.enabled && page.Command5.visible);
 }
 
 TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPreparesAndCountsAfterThePictures) {
-    B3& page =
-        open({edited(givePicture(QStringLiteral("one_1.jpg"))), edited(givePicture(QStringLiteral("two_2.jpg")))});
+    B3& page = open({edited(givePicture(u"one_1.jpg"_s)), edited(givePicture(u"two_2.jpg"_s))});
     bool countedEarly = false;
     QStringList positions;
     machine.pump.onPump = [&] {
@@ -250,51 +243,50 @@ TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPreparesAndCountsAfterTh
         page.Timer2_Tick();
         if (page.Label17.text.isEmpty())
             return;
-        countedEarly = countedEarly || exists(QStringLiteral("C:\\vedron\\mispar.txt")) || exists(logPath());
+        countedEarly = countedEarly || exists(u"C:\\vedron\\mispar.txt"_s) || exists(logPath());
         if (positions.value(positions.size() - 1) != page.Label17.text)
             positions += page.Label17.text;
         EXPECT_EQ(page.List2.currentIndex() + 1, page.Label17.text.toInt());
-        EXPECT_EQ(page.Label16.text, QStringLiteral("2"));
+        EXPECT_EQ(page.Label16.text, u"2"_s);
     };
     page.Timer2_Tick();
     machine.pump.onPump = {};
-    EXPECT_EQ(positions, QStringList({QStringLiteral("1"), QStringLiteral("2")}));
+    EXPECT_EQ(positions, QStringList({u"1"_s, u"2"_s}));
     EXPECT_FALSE(countedEarly);
     EXPECT_EQ(printFiles().size(), 2);
-    EXPECT_FALSE(machine.files.folderExists(folder(QStringLiteral("106"))));
+    EXPECT_FALSE(machine.files.folderExists(folder(u"106"_s)));
 }
 
 TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     QStringList items;
     for (int i = 0; i < 8; ++i)
-        items += edited(givePicture(QStringLiteral("picture%1.jpg").arg(i)), record(toned));
+        items += edited(givePicture(u"picture%1.jpg"_s.arg(i)), record(toned));
     B3& page = open(items);
     machine.pump.onPump = [&] {
-        if (page.Label17.text == QStringLiteral("3"))
+        if (page.Label17.text == u"3"_s)
             page.Command2_Click();
     };
     page.Timer2_Tick();
     EXPECT_TRUE(chain.hasEnded());
     EXPECT_LT(printFiles().size(), 5);
     EXPECT_FALSE(exists(logPath()));
-    EXPECT_FALSE(exists(QStringLiteral("C:\\vedron\\mispar.txt"))) << "an abandoned order burns no number";
-    for (const auto& entry :
-         std::filesystem::directory_iterator(*machine.drives.toHost(QStringLiteral("C:\\2000lumora"))))
+    EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_s)) << "an abandoned order burns no number";
+    for (const auto& entry : std::filesystem::directory_iterator(*machine.drives.toHost(u"C:\\2000lumora"_s)))
         EXPECT_TRUE(entry.is_directory() || entry.path().filename() == "bw.bmp") << entry.path();
 }
 
 TEST_F(PreparingAnEditedOrder, keepsWhatWasPreparedWhenTheLogCanNotBeWritten) {
     makeFolder(logPath());
-    B3& page = open({edited(givePicture(QStringLiteral("one_1.jpg")))});
+    B3& page = open({edited(givePicture(u"one_1.jpg"_s))});
     page.Timer2_Tick();
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(QStringLiteral("KUP_1234^105.txt")));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"KUP_1234^105.txt"_s));
     EXPECT_EQ(front(), PageId::B3);
     EXPECT_EQ(printFiles().size(), 1);
     std::filesystem::remove(*machine.drives.toHost(logPath()));
     page.Command5_Click();
     EXPECT_EQ(front(), PageId::FtpFrm);
-    EXPECT_EQ(state.MisparHazmana, QStringLiteral("105")) << "the same number at the next press";
+    EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the same number at the next press";
 }
 
 TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
@@ -302,18 +294,17 @@ TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
     QStringList items;
     for (int i = 0; i < pictures; ++i) {
         const QByteArray bytes = *encodeJpeg(noisyPicture(60, 40, 5U + static_cast<unsigned>(i)), 90);
-        items += edited(giveFile(QStringLiteral("picture%1.jpg").arg(i), bytes), i % 2 == 0 ? record() : record(toned));
+        items += edited(giveFile(u"picture%1.jpg"_s.arg(i), bytes), i % 2 == 0 ? record() : record(toned));
     }
     const SmallDisk disk(1600);
     if (!disk.available())
         GTEST_SKIP() << "this user may not mount a small disk";
-    std::filesystem::remove_all(*machine.drives.toHost(QStringLiteral("C:\\2000lumora")));
-    std::filesystem::create_directory_symlink(disk.path(), *machine.drives.toHost(QStringLiteral("C:\\2000lumora")));
-    makeFolder(QStringLiteral("C:\\2000lumora\\zmany"));
+    std::filesystem::remove_all(*machine.drives.toHost(u"C:\\2000lumora"_s));
+    std::filesystem::create_directory_symlink(disk.path(), *machine.drives.toHost(u"C:\\2000lumora"_s));
+    makeFolder(u"C:\\2000lumora\\zmany"_s);
     const QStringList failed = prepare(items);
     ASSERT_FALSE(machine.dialogs.messages.isEmpty());
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(QStringLiteral("2000lumora")))
-        << machine.dialogs.messages[0].toStdString();
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"2000lumora"_s)) << machine.dialogs.messages[0].toStdString();
     const QStringList made = printFiles();
     EXPECT_FALSE(made.isEmpty());
     EXPECT_LT(made.size(), pictures);
@@ -323,12 +314,12 @@ TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
 }
 
 TEST_F(PreparingAnEditedOrder, saysItsTextsInTheLanguageOfTheSession) {
-    B3& page = open({edited(givePicture(QStringLiteral("one_1.jpg")))});
-    EXPECT_EQ(page.Label4Title.text, QStringLiteral("הכנת תמונות למשלוח"));
+    B3& page = open({edited(givePicture(u"one_1.jpg"_s))});
+    EXPECT_EQ(page.Label4Title.text, u"הכנת תמונות למשלוח"_s);
     EXPECT_TRUE(page.Command7.visible && !page.Command2.visible);
     state.EnglishTips = 1;
     page.setTexts();
-    EXPECT_EQ(page.Command2.text, QStringLiteral(" Stop All and EXIT"));
+    EXPECT_EQ(page.Command2.text, u" Stop All and EXIT"_s);
     for (const Caption* caption :
          {&page.Label4Title, &page.Label4Progress, &page.Label4fail, &page.Label1, &page.Label2, &page.Command1,
           &page.Command2, &page.Command5, &page.Command7, &page.Picture5}) {

@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 using Changes = QList<std::pair<EditRecord::Column, QString>>;
 
 // A picture that was opened in the editor and left as it is, with some fields changed.
@@ -18,15 +20,15 @@ inline QString record(const Changes& changes = {}) {
     const auto set = [&](EditRecord::Column column, const QString& value) {
         text.replace(column.position - 1, column.width, LeftField(value, column.width));
     };
-    set(EditRecord::PanX, QStringLiteral("225"));
-    set(EditRecord::PanY, QStringLiteral("150"));
+    set(EditRecord::PanX, u"225"_s);
+    set(EditRecord::PanY, u"150"_s);
     for (const auto& [column, value] : changes)
         set(column, value);
     return text;
 }
 
-inline const Changes toned = {{EditRecord::ToneFlag, QStringLiteral("1")}};
-inline const Changes redEyesCorrected = {{EditRecord::RedMarker, QStringLiteral("RED")}};
+inline const Changes toned = {{EditRecord::ToneFlag, u"1"_s}};
+inline const Changes redEyesCorrected = {{EditRecord::RedMarker, u"RED"_s}};
 inline const Changes both = toned + redEyesCorrected;
 
 class PreparingAnEditedOrder : public PreparingAPlainOrder {
@@ -40,9 +42,8 @@ protected:
             makeFolder(QString::fromLatin1(path));
     }
 
-    static QString edited(const QString& path, const QString& edits = record(),
-                          const QString& copies = QStringLiteral("1 ")) {
-        return copies + QStringLiteral("1015GNB") + edits + path;
+    static QString edited(const QString& path, const QString& edits = record(), const QString& copies = u"1 "_s) {
+        return copies + u"1015GNB"_s + edits + path;
     }
     B3& open(const QStringList& items) {
         state.handOver.lines = items;
@@ -61,7 +62,7 @@ protected:
         EXPECT_TRUE(Bitmap(40, 30, colour).image().save(hostText(correctedPath(path)), "BMP"));
     }
     static QString correctedPath(const QString& path) {
-        return QStringLiteral("C:\\2000lumora\\zmany\\tempred\\") + MangleFileName(path);
+        return u"C:\\2000lumora\\zmany\\tempred\\"_s + MangleFileName(path);
     }
     QString hostText(const QString& path) const { return toText(*machine.drives.toHost(path)); }
     bool exists(const QString& path) const { return machine.files.fileExists(path); }
@@ -82,8 +83,8 @@ protected:
         EXPECT_NEAR(found.blue(), wanted.blue(), 4);
     }
 
-    const QString bw = QStringLiteral("C:\\2000lumora\\bw.bmp");
-    const QString jobFolder = QStringLiteral("C:\\2000lumora\\zmany\\job_folder");
+    const QString bw = u"C:\\2000lumora\\bw.bmp"_s;
+    const QString jobFolder = u"C:\\2000lumora\\zmany\\job_folder"_s;
 };
 
 } // namespace lumora

@@ -8,6 +8,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // The workspace on a disk that runs full in the middle of the order. Where this user may not mount one, files that may
 // not grow beyond a limit stand in for it.
 TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
@@ -15,14 +17,13 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
     QStringList items;
     for (int i = 0; i < pictures; ++i) {
         const int side = i % 2 == 0 ? 60 : 200;
-        items += line(giveFile(QStringLiteral("pic%1.jpg").arg(i), *encodeJpeg(noisyPicture(side, side, 5U + i), 90)));
+        items += line(giveFile(u"pic%1.jpg"_s.arg(i), *encodeJpeg(noisyPicture(side, side, 5U + i), 90)));
     }
     rlimit before{};
     ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &before), 0);
     {
         const SmallDisk disk(200);
-        std::filesystem::create_directory_symlink(disk.path(),
-                                                  *machine.drives.toHost(QStringLiteral("C:\\2000lumora")));
+        std::filesystem::create_directory_symlink(disk.path(), *machine.drives.toHost(u"C:\\2000lumora"_s));
         if (!disk.available()) {
             std::signal(SIGXFSZ, SIG_IGN);
             const rlimit limit{20000, before.rlim_max};
@@ -34,7 +35,7 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
         ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &before), 0);
 
         ASSERT_FALSE(machine.dialogs.messages.isEmpty());
-        EXPECT_TRUE(machine.dialogs.messages[0].contains(QStringLiteral("C:\\2000lumora\\!!000\\")))
+        EXPECT_TRUE(machine.dialogs.messages[0].contains(u"C:\\2000lumora\\!!000\\"_s))
             << machine.dialogs.messages[0].toStdString();
         const QStringList made = printFiles();
         EXPECT_FALSE(made.isEmpty());
@@ -43,7 +44,7 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
         for (const QString& name : made)
             EXPECT_TRUE(unpacked(name)) << name.toStdString();
         for (int i = 0; i < pictures; ++i)
-            EXPECT_TRUE(machine.files.fileExists(QStringLiteral("C:\\pics\\pic%1.jpg").arg(i)));
+            EXPECT_TRUE(machine.files.fileExists(u"C:\\pics\\pic%1.jpg"_s.arg(i)));
     }
 }
 

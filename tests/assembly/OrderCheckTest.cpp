@@ -5,12 +5,14 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class CheckingAnOrder : public PreparingAPlainOrder {
 protected:
     CheckingAnOrder() {
-        const QString bad = giveFile(QStringLiteral("bad.jpg"), "no picture");
-        openWith({line(givePicture(QStringLiteral("תמונה 01.jpg")), QStringLiteral("12")), line(bad),
-                  line(givePicture(QStringLiteral("ajpg"))), line(givePicture(QStringLiteral("two.jpg")))})
+        const QString bad = giveFile(u"bad.jpg"_s, "no picture");
+        openWith({line(givePicture(u"תמונה 01.jpg"_s), u"12"_s), line(bad), line(givePicture(u"ajpg"_s)),
+                  line(givePicture(u"two.jpg"_s))})
             .Command6_Click();
     }
 
@@ -31,15 +33,15 @@ protected:
         return found;
     }
 
-    const QString two = QStringLiteral("1 1015GNB0003_0174776F.jpp");
-    const QString log = QStringLiteral("2026_11_21_KUP_1234^105.txt");
+    const QString two = u"1 1015GNB0003_0174776F.jpp"_s;
+    const QString log = u"2026_11_21_KUP_1234^105.txt"_s;
 };
 
 TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
     const Result<OrderFindings> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
     ASSERT_TRUE(report);
     EXPECT_EQ(report->faults, QStringList());
-    EXPECT_EQ(report->order, QStringLiteral("2026_11_21_KUP_1234^105"));
+    EXPECT_EQ(report->order, u"2026_11_21_KUP_1234^105"_s);
     EXPECT_EQ(report->items, 4);
     EXPECT_EQ(report->prints, 2);
     EXPECT_EQ(report->failed, 1);
@@ -52,12 +54,12 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
         EXPECT_TRUE(faults.join(u'|').contains(about)) << faults.join(u'|').toStdString();
     };
     oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.chop(1); }), two);
-    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.replace("Dana", "Dora"); }), QStringLiteral("Dora"));
-    oneFault(faultsWith(QStringLiteral("!105_1234.jpp"), [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }),
-             QStringLiteral("!105_1234.jpp"));
+    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.replace("Dana", "Dora"); }), u"Dora"_s);
+    oneFault(faultsWith(u"!105_1234.jpp"_s, [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }),
+             u"!105_1234.jpp"_s);
     oneFault(
         faultsWith(log, [](QByteArray& bytes) { bytes.replace("fail_\",\"C:\\pics\\bad", "fail_\",\"C:\\pics\\bed"); }),
-        QStringLiteral("bad.jpg"));
+        u"bad.jpg"_s);
     EXPECT_EQ(
         faultsWith(log, [](QByteArray& bytes) { bytes.replace("\"Shemot.TotalPics\",15", "\"Shemot.TotalPics\",16"); })
             .size(),
@@ -70,9 +72,9 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
     oneFault(faultsWith(two, [&](QByteArray& bytes) { bytes = *packPrintFile(picture, {56, 30}, tail); }), two);
 
     ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + two));
-    oneFault(faults(), QStringLiteral("two.jpg"));
+    oneFault(faults(), u"two.jpg"_s);
     ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + log));
-    oneFault(faults(), QStringLiteral("no order log"));
+    oneFault(faults(), u"no order log"_s);
 }
 
 } // namespace

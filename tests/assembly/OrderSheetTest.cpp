@@ -10,104 +10,106 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 QStringList linesOf(SessionState& state) {
     return plainSheetLines(state, FixedClock().now());
 }
 
 SessionState sessionOfTheExample() {
     SessionState state;
-    state.shemot.n1 = QStringLiteral("Dana Levi");
-    state.shemot.n2 = QStringLiteral("03-1234567");
-    state.shemot.n3 = QStringLiteral("Herzl 1");
-    state.shemot.ppr = QStringLiteral("10/15");
-    state.shemot.maat = QStringLiteral("Matte");
-    state.shemot.FillFit = QStringLiteral("FIT");
-    state.shemot.Bord = QStringLiteral("NB");
-    state.shemot.Mail = QStringLiteral("dana@example.com");
-    state.shemot.Hearot = QStringLiteral("gift - ");
-    state.shemot.Girsa = QStringLiteral("4.00");
+    state.shemot.n1 = u"Dana Levi"_s;
+    state.shemot.n2 = u"03-1234567"_s;
+    state.shemot.n3 = u"Herzl 1"_s;
+    state.shemot.ppr = u"10/15"_s;
+    state.shemot.maat = u"Matte"_s;
+    state.shemot.FillFit = u"FIT"_s;
+    state.shemot.Bord = u"NB"_s;
+    state.shemot.Mail = u"dana@example.com"_s;
+    state.shemot.Hearot = u"gift - "_s;
+    state.shemot.Girsa = u"4.00"_s;
     state.shemot.TotalPics = 13;
-    state.MisparHazmana = QStringLiteral("105");
-    state.shemot.ser = QStringLiteral("1234");
+    state.MisparHazmana = u"105"_s;
+    state.shemot.ser = u"1234"_s;
     return state;
 }
 
 TEST(OrderSheet, tellsTheOrderInSixLines) {
     SessionState state = sessionOfTheExample();
     EXPECT_EQ(linesOf(state), QStringList({
-                                  QStringLiteral("No.....105_1234    21/11/2026 14:05:09      ver: 4.00"),
-                                  QStringLiteral("  Name....Dana Levi        Tel.....03-1234567      "),
-                                  QStringLiteral("    Herzl 1      "),
-                                  QStringLiteral("  Paper size....10/15       paper  KindMatte    FIT"),
-                                  QStringLiteral("  Total pictures...13   Border=  NB   Mail  dana@example.com"),
-                                  QStringLiteral("gift - "),
+                                  u"No.....105_1234    21/11/2026 14:05:09      ver: 4.00"_s,
+                                  u"  Name....Dana Levi        Tel.....03-1234567      "_s,
+                                  u"    Herzl 1      "_s,
+                                  u"  Paper size....10/15       paper  KindMatte    FIT"_s,
+                                  u"  Total pictures...13   Border=  NB   Mail  dana@example.com"_s,
+                                  u"gift - "_s,
                               }));
-    state.shemot.ppr = QStringLiteral("zz/zz");
-    state.shemot.Soog1 = QStringLiteral("one");
-    state.shemot.Soog2 = QStringLiteral("two");
-    EXPECT_EQ(linesOf(state)[3], QStringLiteral("zz/zz   paper  Kindtwo one"));
+    state.shemot.ppr = u"zz/zz"_s;
+    state.shemot.Soog1 = u"one"_s;
+    state.shemot.Soog2 = u"two"_s;
+    EXPECT_EQ(linesOf(state)[3], u"zz/zz   paper  Kindtwo one"_s);
     EXPECT_EQ(orderSheetBackground(SheetKind::Plain, state), QColor(255, 192, 255));
-    state.KodMishloach = QStringLiteral("HOM");
-    EXPECT_FALSE(linesOf(state)[0].contains(QStringLiteral("קבלת")));
-    state.KodMishloach = QStringLiteral("LOB");
-    EXPECT_TRUE(linesOf(state)[0].contains(QStringLiteral("קבלת תמונות")));
+    state.KodMishloach = u"HOM"_s;
+    EXPECT_FALSE(linesOf(state)[0].contains(u"קבלת"_s));
+    state.KodMishloach = u"LOB"_s;
+    EXPECT_TRUE(linesOf(state)[0].contains(u"קבלת תמונות"_s));
 }
 
 TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
     SessionState state = sessionOfTheExample();
-    state.KodMishloach = QStringLiteral("HOM");
+    state.KodMishloach = u"HOM"_s;
     const QStringList wanted = {
-        QStringLiteral("No.....105_1234    21/11/2026 14:05:09     קבלת תמונות בדואר  ver: 4.00"),
-        QStringLiteral("  Name....Dana Levi        Tel.....03-1234567      "),
-        QStringLiteral("    Herzl 1      "),
-        QStringLiteral("  Paper size....10/15       paper Kind  Matte"),
-        QStringLiteral("  Total pictures...13   Border=  NB     Mail  dana@example.com"),
-        QStringLiteral("  gift - "),
+        u"No.....105_1234    21/11/2026 14:05:09     קבלת תמונות בדואר  ver: 4.00"_s,
+        u"  Name....Dana Levi        Tel.....03-1234567      "_s,
+        u"    Herzl 1      "_s,
+        u"  Paper size....10/15       paper Kind  Matte"_s,
+        u"  Total pictures...13   Border=  NB     Mail  dana@example.com"_s,
+        u"  gift - "_s,
     };
     EXPECT_EQ(editedSheetLines(state, FixedClock().now()), wanted);
-    state.shemot.ppr = QStringLiteral("zz/zz");
+    state.shemot.ppr = u"zz/zz"_s;
     EXPECT_EQ(orderSheetBackground(SheetKind::Edited, state), QColor(Qt::white));
 }
 
 TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
     SessionState state = sessionOfTheExample();
     AlbumDetails& album = state.album;
-    album.ShemZalam = QStringLiteral("Studio Or");
-    album.TelZalam = QStringLiteral("03-7654321");
-    album.ShemErooa = QStringLiteral("Wedding");
-    album.MailZalam = QStringLiteral("studio@example.com");
-    album.GodelLBM = QStringLiteral("30/60");
-    album.SoogLBM = QStringLiteral("פוטו גדול");
-    album.SoogNiar = QStringLiteral("משי");
-    album.SoogKricha = QStringLiteral("חום");
+    album.ShemZalam = u"Studio Or"_s;
+    album.TelZalam = u"03-7654321"_s;
+    album.ShemErooa = u"Wedding"_s;
+    album.MailZalam = u"studio@example.com"_s;
+    album.GodelLBM = u"30/60"_s;
+    album.SoogLBM = u"פוטו גדול"_s;
+    album.SoogNiar = u"משי"_s;
+    album.SoogKricha = u"חום"_s;
     for (std::size_t i = 0; i < album.Tosafot2.size(); ++i)
         album.Tosafot2[i] = QString::number(i);
-    album.KamutHorim = QStringLiteral("2");
-    album.SoogHorim = QStringLiteral("30/60");
+    album.KamutHorim = u"2"_s;
+    album.SoogHorim = u"30/60"_s;
     const QString rule(89, u'-');
     // The event and the address share a line.
     EXPECT_EQ(albumSheetLines(state, FixedClock().now()),
               (QStringList{
-                  QStringLiteral("No.....105_1234    21/11/2026 14:05:09      ver: 4.00"),
-                  QStringLiteral("  ShemZalam....Studio Or        TelZalam.....03-7654321      "),
-                  QStringLiteral("  ShemErooa....Wedding    Herzl 1      "),
-                  QStringLiteral("  MailZalam....studio@example.com"),
-                  QStringLiteral("  Total pictures...13"),
+                  u"No.....105_1234    21/11/2026 14:05:09      ver: 4.00"_s,
+                  u"  ShemZalam....Studio Or        TelZalam.....03-7654321      "_s,
+                  u"  ShemErooa....Wedding    Herzl 1      "_s,
+                  u"  MailZalam....studio@example.com"_s,
+                  u"  Total pictures...13"_s,
                   rule,
-                  QStringLiteral("  GodelLBM....30/60       SoogLBM....פוטו גדול     SoogNiar....משי"),
-                  QStringLiteral("  SoogKricha....חום"),
+                  u"  GodelLBM....30/60       SoogLBM....פוטו גדול     SoogNiar....משי"_s,
+                  u"  SoogKricha....חום"_s,
                   rule,
-                  QStringLiteral(" 0       1       2       3  "),
-                  QStringLiteral(" 4       5       6       7       8     "),
+                  u" 0       1       2       3  "_s,
+                  u" 4       5       6       7       8     "_s,
                   rule,
-                  QStringLiteral(" 2  אלבום הורים  "),
-                  QStringLiteral("   סוג  אלבום  הורים  30/60   "),
+                  u" 2  אלבום הורים  "_s,
+                  u"   סוג  אלבום  הורים  30/60   "_s,
                   rule,
-                  QStringLiteral("  Hearot....gift - "),
+                  u"  Hearot....gift - "_s,
                   rule,
               }));
     EXPECT_EQ(orderSheetBackground(SheetKind::Album, state), QColor(220, 220, 150));
-    state.shemot.ppr = QStringLiteral("zz/zz");
+    state.shemot.ppr = u"zz/zz"_s;
     EXPECT_EQ(orderSheetBackground(SheetKind::Album, state), QColor(255, 192, 255));
 }
 
@@ -161,9 +163,8 @@ TEST_F(ContactSheet, laysEveryPictureInLandscapeATurnedOneClockwise) {
 
 TEST_F(ContactSheet, leavesTheCellOfAnUnreadablePictureEmptyAndGoesOn) {
     OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
-    sheet.drawContactSheet(
-        {{std::filesystem::path("/nowhere.jpg"), QStringLiteral("12_gone")}, picture("land", 400, 300)},
-        [](int) { return true; });
+    sheet.drawContactSheet({{std::filesystem::path("/nowhere.jpg"), u"12_gone"_s}, picture("land", 400, 300)},
+                           [](int) { return true; });
     const QImage& image = sheet.bitmap().image();
     EXPECT_EQ(image.copy(5, 161, 80, 80), OrderSheet(SheetKind::Plain, {80, 80}, Qt::white).bitmap().image());
     EXPECT_TRUE(isRed(image.pixelColor(87 + 10, 161 + 30)));

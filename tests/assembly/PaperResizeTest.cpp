@@ -5,9 +5,11 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(PaperResize, readsAPaperFromItsFirstAndLastTwoCharacters) {
-    EXPECT_EQ(PaperDigits::ofPaper(QStringLiteral("10/15")), (PaperDigits{10, 15}));
-    EXPECT_EQ(PaperDigits::ofPaper(QStringLiteral("09/13")), (PaperDigits{9, 13}));
+    EXPECT_EQ(PaperDigits::ofPaper(u"10/15"_s), (PaperDigits{10, 15}));
+    EXPECT_EQ(PaperDigits::ofPaper(u"09/13"_s), (PaperDigits{9, 13}));
     for (const char* unreadable : {"", "***", "zz/zz", "10/zz", "00/15", "-1/15"})
         EXPECT_EQ(PaperDigits::ofPaper(QString::fromLatin1(unreadable)), std::nullopt) << unreadable;
 }

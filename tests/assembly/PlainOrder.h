@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // A page that is only shown.
 class OtherPage : public Page {
 public:
@@ -35,44 +37,42 @@ protected:
         : chain(machine.pump) {
         state.DiskRoot = machine.drives.programRoot();
         state.Optint = 1;
-        state.MisparHazmana = QStringLiteral("105");
+        state.MisparHazmana = u"105"_s;
         state.profile.JppBase = 30;
         state.profile.JppChunks = 56;
-        state.shemot.n1 = QStringLiteral("Dana Levi");
-        state.shemot.n2 = QStringLiteral("03-1234567");
-        state.shemot.Mail = QStringLiteral("dana@example.com");
-        state.shemot.TimeOfJob = QStringLiteral("2026_11_21_KUP_1234^");
-        state.shemot.Hearot = QStringLiteral("gift - ");
-        state.shemot.ppr = QStringLiteral("10/15");
-        state.shemot.Bord = QStringLiteral("NB");
-        state.shemot.maat = QStringLiteral("מבריק");
-        state.shemot.FillFit = QStringLiteral("FIT");
-        state.shemot.ser = QStringLiteral("1234");
-        state.shemot.Girsa = QStringLiteral("4.00");
+        state.shemot.n1 = u"Dana Levi"_s;
+        state.shemot.n2 = u"03-1234567"_s;
+        state.shemot.Mail = u"dana@example.com"_s;
+        state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+        state.shemot.Hearot = u"gift - "_s;
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.Bord = u"NB"_s;
+        state.shemot.maat = u"מבריק"_s;
+        state.shemot.FillFit = u"FIT"_s;
+        state.shemot.ser = u"1234"_s;
+        state.shemot.Girsa = u"4.00"_s;
         state.transfer.SugMishloah = 1;
         for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
             chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });
         chain.registerPage(PageId::Form2, [this] { return std::make_unique<Form2>(state, machine.platform, chain); });
-        makeFolder(QStringLiteral("C:\\vedron"));
-        makeFolder(QStringLiteral("C:\\pics"));
+        makeFolder(u"C:\\vedron"_s);
+        makeFolder(u"C:\\pics"_s);
     }
 
     void makeFolder(const QString& path) { std::filesystem::create_directories(*machine.drives.toHost(path)); }
 
     QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
-        const QString path = QStringLiteral("C:\\pics\\") + name;
+        const QString path = u"C:\\pics\\"_s + name;
         EXPECT_TRUE(machine.files.writeWhole(path, *encodeJpeg(Bitmap(width, height, colour), 92)));
         return path;
     }
     QString giveFile(const QString& name, const QByteArray& bytes) {
-        const QString path = QStringLiteral("C:\\pics\\") + name;
+        const QString path = u"C:\\pics\\"_s + name;
         EXPECT_TRUE(machine.files.writeWhole(path, bytes));
         return path;
     }
 
-    static QString line(const QString& path, const QString& copies = QStringLiteral("1 ")) {
-        return copies + QStringLiteral("1015GNB") + path;
-    }
+    static QString line(const QString& path, const QString& copies = u"1 "_s) { return copies + u"1015GNB"_s + path; }
 
     Form2& openWith(const QStringList& items) {
         state.handOver.lines = items;
@@ -80,19 +80,19 @@ protected:
         return *dynamic_cast<Form2*>(chain.find(PageId::Form2));
     }
 
-    QString folder(const QString& number = QStringLiteral("105")) const {
-        return QStringLiteral("C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^") + number;
+    QString folder(const QString& number = u"105"_s) const {
+        return u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^"_s + number;
     }
-    QString logPath(const QString& number = QStringLiteral("105")) const {
-        return folder(number) + QStringLiteral("\\2026_11_21_KUP_1234^") + number + QStringLiteral(".txt");
+    QString logPath(const QString& number = u"105"_s) const {
+        return folder(number) + u"\\2026_11_21_KUP_1234^"_s + number + u".txt"_s;
     }
-    QStringList printFiles(const QString& number = QStringLiteral("105")) const {
-        QStringList names = machine.files.names(folder(number), QStringLiteral("*.jpp"));
+    QStringList printFiles(const QString& number = u"105"_s) const {
+        QStringList names = machine.files.names(folder(number), u"*.jpp"_s);
         names.removeIf([](const QString& name) { return name.startsWith(u'!'); });
         return names;
     }
     // The picture inside a print file.
-    Result<PrintFileContent> unpacked(const QString& name, const QString& number = QStringLiteral("105")) const {
+    Result<PrintFileContent> unpacked(const QString& name, const QString& number = u"105"_s) const {
         const Result<QByteArray> bytes = machine.files.read(folder(number) + u'\\' + name);
         return bytes ? readPrintFile(*bytes, PrintFileShape::of(state.profile))
                      : Result<PrintFileContent>(bytes.failure());

@@ -9,13 +9,15 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 SessionState sessionOfTheExample() {
     SessionState state;
-    state.shemot.n1 = QStringLiteral("Dana Levi");
-    state.shemot.n2 = QStringLiteral("03-1234567");
+    state.shemot.n1 = u"Dana Levi"_s;
+    state.shemot.n2 = u"03-1234567"_s;
     state.shemot.TotalPics = 13;
-    state.MisparHazmana = QStringLiteral("105");
-    state.shemot.ser = QStringLiteral("1234");
+    state.MisparHazmana = u"105"_s;
+    state.shemot.ser = u"1234"_s;
     return state;
 }
 
@@ -101,18 +103,18 @@ TEST(PrintFile, refusesWhatDoesNotHoldTogether) {
 TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
     SessionState state = sessionOfTheExample();
     state.shemot.n1 = QString::fromUtf8("דנה לוי-כהן\U0001F600");
-    state.shemot.n2 = QStringLiteral("+972-3-1234567");
+    state.shemot.n2 = u"+972-3-1234567"_s;
     state.shemot.TotalPics = 1234;
-    state.MisparHazmana = QStringLiteral("1005");
+    state.MisparHazmana = u"1005"_s;
     const QByteArray tail = OrderTail::of(state).shortForm();
     EXPECT_EQ(tail.size(), 40);
     const std::optional<OrderTail> read = OrderTail::parse(tail);
     ASSERT_TRUE(read);
-    EXPECT_EQ(read->telephone, QStringLiteral("+972-3-123"));
-    EXPECT_EQ(read->name, QStringLiteral("דנה לוי-כה"));
-    EXPECT_EQ(read->totalPics, QStringLiteral("123"));
-    EXPECT_EQ(read->orderNumber, QStringLiteral("100"));
-    EXPECT_EQ(read->serial, QStringLiteral("1234"));
+    EXPECT_EQ(read->telephone, u"+972-3-123"_s);
+    EXPECT_EQ(read->name, u"דנה לוי-כה"_s);
+    EXPECT_EQ(read->totalPics, u"123"_s);
+    EXPECT_EQ(read->orderNumber, u"100"_s);
+    EXPECT_EQ(read->serial, u"1234"_s);
 
     state.shemot.n1 = QString::fromUtf8("\U0001F600\U0001F600");
     EXPECT_EQ(OrderTail::of(state).shortForm().size(), 40) << "a character outside the code page is one byte";
@@ -120,19 +122,19 @@ TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
 
 TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {
     const OrderTail tail = OrderTail::of(sessionOfTheExample());
-    const QString name = QStringLiteral("a very long name of 30 letters");
+    const QString name = u"a very long name of 30 letters"_s;
     EXPECT_EQ(tail.form(40, name), tail.shortForm());
     EXPECT_EQ(tail.form(60, name), tail.shortForm() + "^ name of 30 letters");
-    EXPECT_EQ(tail.form(60, QStringLiteral("exactly nineteen ch")), tail.shortForm() + "^exactly nineteen ch");
-    EXPECT_EQ(tail.form(60, QStringLiteral("twentycharactersname")), tail.shortForm() + "^wentycharactersname");
+    EXPECT_EQ(tail.form(60, u"exactly nineteen ch"_s), tail.shortForm() + "^exactly nineteen ch");
+    EXPECT_EQ(tail.form(60, u"twentycharactersname"_s), tail.shortForm() + "^wentycharactersname");
     EXPECT_EQ(tail.form(0, name), QByteArray());
-    EXPECT_EQ(OrderTail::parse(tail.form(60, QStringLiteral("תמונה")))->baseName, QStringLiteral("תמונה"));
+    EXPECT_EQ(OrderTail::parse(tail.form(60, u"תמונה"_s))->baseName, u"תמונה"_s);
 }
 
 TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
-    const QString base = PrintBaseName(QStringLiteral("C:\\pics\\תמונה 01.jpg"));
-    const PrintFileName name{QStringLiteral("121015MWB"), 7, 3, base};
-    EXPECT_EQ(name.text(), QStringLiteral("121015MWB0007_03FAEEE5F0E4203031.jpp"));
+    const QString base = PrintBaseName(u"C:\\pics\\תמונה 01.jpg"_s);
+    const PrintFileName name{u"121015MWB"_s, 7, 3, base};
+    EXPECT_EQ(name.text(), u"121015MWB0007_03FAEEE5F0E4203031.jpp"_s);
     const std::optional<PrintFileName> read = PrintFileName::parse(name.text());
     ASSERT_TRUE(read);
     EXPECT_EQ(read->code, name.code);
@@ -141,10 +143,8 @@ TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
     EXPECT_EQ(read->baseName, base);
     EXPECT_EQ(read->copies(), 12);
 
-    EXPECT_EQ((PrintFileName{QStringLiteral("1 1015GNB"), 12345, 10, QStringLiteral("a")}.text()),
-              QStringLiteral("1 1015GNB2345_1061.jpp"));
-    EXPECT_EQ(PrintBaseName(QStringLiteral("C:\\p\\0123456789012345678901234.jpg")),
-              QStringLiteral("56789012345678901234"));
+    EXPECT_EQ((PrintFileName{u"1 1015GNB"_s, 12345, 10, u"a"_s}.text()), u"1 1015GNB2345_1061.jpp"_s);
+    EXPECT_EQ(PrintBaseName(u"C:\\p\\0123456789012345678901234.jpg"_s), u"56789012345678901234"_s);
     for (const char* other :
          {"!105_1234.jpp", "121015MWB007_0361.jpp", "121015MWB0007_036.jpp", "121015MWB0007_03.jpp", ""})
         EXPECT_FALSE(PrintFileName::parse(QString::fromLatin1(other))) << other;

@@ -11,6 +11,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class PrintingAgain : public PreparingAnEditedOrder {
 protected:
     QString giveNoise(const QString& name, int width, int height) {
@@ -18,50 +20,40 @@ protected:
     }
 
     QStringList dozen() {
-        makeFolder(QStringLiteral("C:\\pics\\more"));
-        const QString frames = QStringLiteral("C:\\2000lumora\\misgarot\\demo");
+        makeFolder(u"C:\\pics\\more"_s);
+        const QString frames = u"C:\\2000lumora\\misgarot\\demo"_s;
         makeFolder(frames);
         Bitmap frame(60, 40, Qt::black);
         frame.image().fill(Qt::black);
         for (int x = 0; x < 60; ++x)
             frame.image().setPixelColor(x, x % 40, QColor(90, 20, 160));
-        EXPECT_TRUE(frame.image().save(hostText(frames + QStringLiteral("\\007.bmp")), "BMP"));
+        EXPECT_TRUE(frame.image().save(hostText(frames + u"\\007.bmp"_s), "BMP"));
 
         using namespace EditRecord;
-        const Changes framed = {{FrameName, QStringLiteral("007")}, {FrameFolder, QStringLiteral("demo")}};
+        const Changes framed = {{FrameName, u"007"_s}, {FrameFolder, u"demo"_s}};
         const auto words = [](const QString& text) {
-            return Changes{{TextOn, QStringLiteral("1")},
-                           {TextFont, QStringLiteral("David")},
-                           {TextFontSize, QStringLiteral("30")},
-                           {TextX, QStringLiteral("60")},
-                           {TextY, QStringLiteral("90")},
-                           {TextRed, QStringLiteral("255")},
-                           {TextBody, text}};
+            return Changes{{TextOn, u"1"_s}, {TextFont, u"David"_s}, {TextFontSize, u"30"_s}, {TextX, u"60"_s},
+                           {TextY, u"90"_s}, {TextRed, u"255"_s},    {TextBody, text}};
         };
-        const QString turned = record({{GainR, QStringLiteral("1.3")},
-                                       {RotationCode, QStringLiteral("195")},
-                                       {ZoomPercent, QStringLiteral("80")}});
-        const QString fixed = giveNoise(QStringLiteral("eyes1.jpg"), 80, 60);
-        const QString fixedGrey = giveNoise(QStringLiteral("eyes2.jpg"), 80, 60);
+        const QString turned = record({{GainR, u"1.3"_s}, {RotationCode, u"195"_s}, {ZoomPercent, u"80"_s}});
+        const QString fixed = giveNoise(u"eyes1.jpg"_s, 80, 60);
+        const QString fixedGrey = giveNoise(u"eyes2.jpg"_s, 80, 60);
         giveCorrected(fixed, Qt::darkGreen);
         EXPECT_TRUE(noisyPicture(90, 60, 5).image().save(hostText(correctedPath(fixedGrey)), "BMP"));
-        return {edited(giveNoise(QStringLiteral("IMG_0001.jpg"), 300, 200)),
-                edited(giveNoise(QStringLiteral("more\\IMG_0001.jpg"), 200, 300), turned),
-                edited(giveNoise(QStringLiteral("grey1.jpg"), 2400, 1800), record(toned)),
-                edited(giveNoise(QStringLiteral("grey2.jpg"), 300, 400),
-                       record(toned + Changes{{GainB, QStringLiteral("0.5")}})),
-                edited(fixed, record(redEyesCorrected)),
-                edited(fixedGrey, record(both)),
-                edited(giveNoise(QStringLiteral("תמונה של סבתא.JPG"), 300, 200),
-                       record(words(QStringLiteral("חג שמח,\r\n2026 All")))),
-                edited(giveNoise(QStringLiteral("framed.jpg"), 200, 300), record(framed), QStringLiteral("12")),
-                edited(giveNoise(QStringLiteral("never opened.jpg"), 500, 100), EditRecord::newPicture()),
-                edited(giveNoise(QStringLiteral("far out.jpg"), 300, 200),
-                       record({{ZoomPercent, QStringLiteral("250")}, {PanX, QStringLiteral("-30")}})),
-                edited(giveNoise(QStringLiteral("a \"quoted\" name.jpg"), 300, 200),
-                       record(framed + toned + words(QStringLiteral("all \"of\" it")))),
-                edited(giveNoise(QStringLiteral("no such frame.jpg"), 300, 200),
-                       record({{FrameName, QStringLiteral("099")}, {FrameFolder, QStringLiteral("..")}}))};
+        return {
+            edited(giveNoise(u"IMG_0001.jpg"_s, 300, 200)),
+            edited(giveNoise(u"more\\IMG_0001.jpg"_s, 200, 300), turned),
+            edited(giveNoise(u"grey1.jpg"_s, 2400, 1800), record(toned)),
+            edited(giveNoise(u"grey2.jpg"_s, 300, 400), record(toned + Changes{{GainB, u"0.5"_s}})),
+            edited(fixed, record(redEyesCorrected)),
+            edited(fixedGrey, record(both)),
+            edited(giveNoise(u"תמונה של סבתא.JPG"_s, 300, 200), record(words(u"חג שמח,\r\n2026 All"_s))),
+            edited(giveNoise(u"framed.jpg"_s, 200, 300), record(framed), u"12"_s),
+            edited(giveNoise(u"never opened.jpg"_s, 500, 100), EditRecord::newPicture()),
+            edited(giveNoise(u"far out.jpg"_s, 300, 200), record({{ZoomPercent, u"250"_s}, {PanX, u"-30"_s}})),
+            edited(giveNoise(u"a \"quoted\" name.jpg"_s, 300, 200), record(framed + toned + words(u"all \"of\" it"_s))),
+            edited(giveNoise(u"no such frame.jpg"_s, 300, 200),
+                   record({{FrameName, u"099"_s}, {FrameFolder, u".."_s}}))};
     }
 
     // The packed pictures in the order of the list.
@@ -87,7 +79,7 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
 
     chain.unload(PageId::FtpFrm);
     ASSERT_EQ(prepare(items), QStringList());
-    EXPECT_NE(state.MisparHazmana, QStringLiteral("105")) << "a folder of its own";
+    EXPECT_NE(state.MisparHazmana, u"105"_s) << "a folder of its own";
     const QMap<int, QByteArray> second = packed();
     ASSERT_EQ(second.size(), 12);
 
@@ -106,10 +98,8 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
         const QTemporaryDir out;
         QProcess render;
         render.start(QStringLiteral(LUMORA_RENDER),
-                     {QStringLiteral("print"), QStringLiteral("--paper"), QStringLiteral("10/15"),
-                      QStringLiteral("--record"), item.record, QStringLiteral("--frames"),
-                      hostText(QStringLiteral("C:\\2000lumora\\misgarot")), QStringLiteral("--out"), out.path(),
-                      source});
+                     {u"print"_s, u"--paper"_s, u"10/15"_s, u"--record"_s, item.record, u"--frames"_s,
+                      hostText(u"C:\\2000lumora\\misgarot"_s), u"--out"_s, out.path(), source});
         ASSERT_TRUE(render.waitForFinished(60000));
         ASSERT_EQ(render.exitCode(), 0) << render.readAllStandardError().constData();
         const QStringList made = QDir(out.path()).entryList(QDir::Files);

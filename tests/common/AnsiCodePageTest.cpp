@@ -5,6 +5,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(AnsiCodePage, GivesEachAssignedByteBackAsItWas) {
     int withoutCharacter = 0;
     for (int byte = 0; byte < 256; ++byte) {
@@ -21,12 +23,12 @@ TEST(AnsiCodePage, GivesEachAssignedByteBackAsItWas) {
 
 TEST(AnsiCodePage, HasTheHebrewLettersAndTheSignsWhereWindowsHasThem) {
     const QByteArray expected = QByteArray::fromHex("fae5e3e4203a20a4808094a9d4");
-    EXPECT_EQ(AnsiCodePage::encode(QStringLiteral("תודה : ₪€€”©װ")).toHex(), expected.toHex());
+    EXPECT_EQ(AnsiCodePage::encode(u"תודה : ₪€€”©װ"_s).toHex(), expected.toHex());
 }
 
 TEST(AnsiCodePage, TurnsEachForeignCharacterIntoOneQuestionMark) {
-    EXPECT_EQ(AnsiCodePage::encode(QStringLiteral("aé漢😀ב")), QByteArray("a???\xe1"));
-    EXPECT_EQ(AnsiCodePage::squeeze(QStringLiteral("ש漢")), QStringLiteral("ש?"));
+    EXPECT_EQ(AnsiCodePage::encode(u"aé漢😀ב"_s), QByteArray("a???\xe1"));
+    EXPECT_EQ(AnsiCodePage::squeeze(u"ש漢"_s), u"ש?"_s);
     const QString loneSurrogates = QString(QChar(0xD800)) + u'x' + QChar(0xDC80);
     EXPECT_EQ(AnsiCodePage::encode(loneSurrogates), QByteArray("?x?"));
 }

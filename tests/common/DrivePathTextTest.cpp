@@ -5,6 +5,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(DrivePathText, TakesPathsApart) {
     const struct {
         const char* path;
@@ -29,9 +31,9 @@ TEST(DrivePathText, TakesPathsApart) {
 }
 
 TEST(DrivePathText, MakesFlatNamesAndJoins) {
-    EXPECT_EQ(MangleFileName(QStringLiteral("C:\\תמונות\\a.jpg")), QStringLiteral("C;]תמונות]a.jpg"));
-    EXPECT_EQ(JoinDrivePath(QStringLiteral("D:\\"), QStringLiteral("a")), QStringLiteral("D:\\a"));
-    EXPECT_EQ(JoinDrivePath(QStringLiteral("D:\\b"), QStringLiteral("a")), QStringLiteral("D:\\b\\a"));
+    EXPECT_EQ(MangleFileName(u"C:\\תמונות\\a.jpg"_s), u"C;]תמונות]a.jpg"_s);
+    EXPECT_EQ(JoinDrivePath(u"D:\\"_s, u"a"_s), u"D:\\a"_s);
+    EXPECT_EQ(JoinDrivePath(u"D:\\b"_s, u"a"_s), u"D:\\b\\a"_s);
 }
 
 } // namespace

@@ -8,10 +8,12 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(LeftField, FillsWithBlanksAndCutsByCharacters) {
-    EXPECT_EQ(LeftField(QStringLiteral("אב"), 4), QStringLiteral("אב  "));
-    EXPECT_EQ(LeftField(QStringLiteral("1234"), 3), QStringLiteral("123"));
-    EXPECT_EQ(LeftField(QString(), 2), QStringLiteral("  "));
+    EXPECT_EQ(LeftField(u"אב"_s, 4), u"אב  "_s);
+    EXPECT_EQ(LeftField(u"1234"_s, 3), u"123"_s);
+    EXPECT_EQ(LeftField(QString(), 2), u"  "_s);
 }
 
 TEST(Val, ReadsTheLeadingNumberOnly) {
@@ -47,16 +49,16 @@ TEST(Val, ReadsTheLeadingNumberOnly) {
     };
     for (const auto& each : cases)
         EXPECT_DOUBLE_EQ(Val(QString::fromUtf8(each.text)), each.number) << each.text;
-    EXPECT_EQ(Val(QStringLiteral("1e999")), std::numeric_limits<double>::max());
-    EXPECT_EQ(Val(QStringLiteral("-1e999")), std::numeric_limits<double>::lowest());
+    EXPECT_EQ(Val(u"1e999"_s), std::numeric_limits<double>::max());
+    EXPECT_EQ(Val(u"-1e999"_s), std::numeric_limits<double>::lowest());
 }
 
 TEST(Val16, RoundsTiesToEvenAndNeverWraps) {
-    EXPECT_EQ(Val16(QStringLiteral("2.5")), 2);
-    EXPECT_EQ(Val16(QStringLiteral("3.5")), 4);
-    EXPECT_EQ(Val16(QStringLiteral("-2.5")), -2);
-    EXPECT_EQ(Val16(QStringLiteral("99999")), 32767);
-    EXPECT_EQ(Val16(QStringLiteral("-99999")), -32768);
+    EXPECT_EQ(Val16(u"2.5"_s), 2);
+    EXPECT_EQ(Val16(u"3.5"_s), 4);
+    EXPECT_EQ(Val16(u"-2.5"_s), -2);
+    EXPECT_EQ(Val16(u"99999"_s), 32767);
+    EXPECT_EQ(Val16(u"-99999"_s), -32768);
     EXPECT_EQ(HoldIn16Bits(std::nan("")), 0);
 }
 
@@ -74,12 +76,12 @@ TEST(PlainNumber, HasSevenDigitsAndNoExponent) {
         {0.879999936F, "0.8799999"},     {0.0399997756F, "0.03999978"}, {-2.24411494e-07F, "-0.0000002244115"}};
     for (const auto& each : cases)
         EXPECT_EQ(PlainNumber(each.number).toStdString(), each.text);
-    EXPECT_EQ(PlainNumber(0), QStringLiteral("0"));
-    EXPECT_EQ(PlainNumber(-0.0F), QStringLiteral("0"));
-    EXPECT_EQ(PlainNumber(100), QStringLiteral("100"));
-    EXPECT_EQ(PlainNumber(16777216.0F), QStringLiteral("16777216"));
-    EXPECT_EQ(PlainNumber(0.99999999F), QStringLiteral("1"));
-    EXPECT_EQ(PlainNumber(std::numeric_limits<float>::infinity()), QStringLiteral("0"));
+    EXPECT_EQ(PlainNumber(0), u"0"_s);
+    EXPECT_EQ(PlainNumber(-0.0F), u"0"_s);
+    EXPECT_EQ(PlainNumber(100), u"100"_s);
+    EXPECT_EQ(PlainNumber(16777216.0F), u"16777216"_s);
+    EXPECT_EQ(PlainNumber(0.99999999F), u"1"_s);
+    EXPECT_EQ(PlainNumber(std::numeric_limits<float>::infinity()), u"0"_s);
 }
 
 TEST(HexToDecimal, ReadsSignedNumbersAndAnswers00ForTheRest) {
@@ -99,18 +101,18 @@ TEST(HexToDecimal, ReadsSignedNumbersAndAnswers00ForTheRest) {
 }
 
 TEST(TextToHex, CarriesANameThereAndBack) {
-    const QString name = QStringLiteral("תמונה 01");
-    EXPECT_EQ(TextToHex(name), QStringLiteral("FAEEE5F0E4203031"));
+    const QString name = u"תמונה 01"_s;
+    EXPECT_EQ(TextToHex(name), u"FAEEE5F0E4203031"_s);
     EXPECT_EQ(HexToChars(TextToHex(name)), name);
-    EXPECT_EQ(TextToHex(QStringLiteral("漢")), QStringLiteral("3F"));
-    EXPECT_EQ(HexToChars(QStringLiteral("4142zz43")), QStringLiteral("AB") + QChar(0) + u'C');
+    EXPECT_EQ(TextToHex(u"漢"_s), u"3F"_s);
+    EXPECT_EQ(HexToChars(u"4142zz43"_s), u"AB"_s + QChar(0) + u'C');
 }
 
 TEST(FixedText, PadsNumbersAndFormsSizeCodes) {
-    EXPECT_EQ(ZeroPadded(7, 4), QStringLiteral("0007"));
-    EXPECT_EQ(ZeroPadded(12345, 4), QStringLiteral("2345"));
-    EXPECT_EQ(SizeCode(QStringLiteral("10/15")), QStringLiteral("1015"));
-    EXPECT_EQ(SizeCode(QStringLiteral("9/13")), QStringLiteral("9/13"));
+    EXPECT_EQ(ZeroPadded(7, 4), u"0007"_s);
+    EXPECT_EQ(ZeroPadded(12345, 4), u"2345"_s);
+    EXPECT_EQ(SizeCode(u"10/15"_s), u"1015"_s);
+    EXPECT_EQ(SizeCode(u"9/13"_s), u"9/13"_s);
     EXPECT_EQ(SizeCode(QString()), QString());
 }
 

@@ -9,6 +9,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 std::vector<std::pair<std::string, std::string>> read(const QByteArray& bytes) {
     std::vector<std::pair<std::string, std::string>> entries;
     for (const auto& entry : ReadListOutput(bytes))
@@ -19,8 +21,8 @@ std::vector<std::pair<std::string, std::string>> read(const QByteArray& bytes) {
 TEST(ListOutput, WritesTextsNumbersAndDatesInTheirForms) {
     const QDateTime moment(QDate(2026, 11, 21), QTime(14, 5, 9));
     ListOutput output;
-    output.pair(QStringLiteral("Shemot.maat"), QStringLiteral("מט"));
-    output.text(QString()).number(-12).text(QStringLiteral("a \"b\", c")).endLine();
+    output.pair(u"Shemot.maat"_s, u"מט"_s);
+    output.text(QString()).number(-12).text(u"a \"b\", c"_s).endLine();
     output.date(moment).date(QDateTime(QDate(2026, 1, 2), QTime(0, 0))).date(std::nullopt).endLine();
     EXPECT_EQ(output.bytes(), QByteArray("\"Shemot.maat\",\"\xee\xe8\"\r\n"
                                          "\"\",-12,\"a \"b\", c\"\r\n"
@@ -31,9 +33,9 @@ TEST(ReadListOutput, TakesAValueBackWhateverItHolds) {
     for (const char* value : {"", "plain", "a, b", "\"quoted\"", "say \"now\", please", "one\ntwo", "\n",
                               "ends with comma,", "C:\\pics\\x.jpg", "  blanks  "}) {
         ListOutput output;
-        output.pair(QStringLiteral("before"), QStringLiteral("1"));
-        output.pair(QStringLiteral("key"), QString::fromUtf8(value));
-        output.pair(QStringLiteral("after"), QStringLiteral("2"));
+        output.pair(u"before"_s, u"1"_s);
+        output.pair(u"key"_s, QString::fromUtf8(value));
+        output.pair(u"after"_s, u"2"_s);
         const std::vector<std::pair<std::string, std::string>> expected = {
             {"before", "1"}, {"key", value}, {"after", "2"}};
         EXPECT_EQ(read(output.bytes()), expected) << value;
@@ -53,9 +55,8 @@ TEST(ReadListOutput, LosesOneDamagedEntryAndNotTheLogBehindIt) {
 }
 
 TEST(ListOutputLines, JoinsABreakInsideAQuotedItem) {
-    EXPECT_EQ(ListOutputLines("\"Dana\r\nLevi\"\r\n\"x\ny\"\r\n"),
-              QStringList({QStringLiteral("\"Dana\r\nLevi\""), QStringLiteral("\"x\ny\"")}));
-    EXPECT_EQ(ListOutputLines("1\r\n\r\n2"), QStringList({QStringLiteral("1"), QString(), QStringLiteral("2")}));
+    EXPECT_EQ(ListOutputLines("\"Dana\r\nLevi\"\r\n\"x\ny\"\r\n"), QStringList({u"\"Dana\r\nLevi\""_s, u"\"x\ny\""_s}));
+    EXPECT_EQ(ListOutputLines("1\r\n\r\n2"), QStringList({u"1"_s, QString(), u"2"_s}));
     EXPECT_EQ(ListOutputLines(""), QStringList());
 }
 
@@ -67,8 +68,8 @@ TEST(ListOutputLines, ReadsALongTextWithAnOpenQuoteInOneGo) {
 }
 
 TEST(WithoutEnds, StripsTheQuotesOfAStore) {
-    EXPECT_EQ(WithoutEnds(QStringLiteral("\"Dana\"")), QStringLiteral("Dana"));
-    EXPECT_EQ(WithoutEnds(QStringLiteral("\"")), QString());
+    EXPECT_EQ(WithoutEnds(u"\"Dana\""_s), u"Dana"_s);
+    EXPECT_EQ(WithoutEnds(u"\""_s), QString());
 }
 
 } // namespace

@@ -7,7 +7,7 @@ using namespace lumora;
 namespace {
 
 ScenarioCommand only(const char* line) {
-    const auto file = ScenarioFile::parse(line, QStringLiteral("s"));
+    const auto file = ScenarioFile::parse(line, u"s"_s);
     EXPECT_TRUE(file.ok()) << line << ": " << (file ? "" : file.failure().message.toStdString());
     EXPECT_EQ(file ? file->commands().size() : 0U, 1U) << line;
     return file && !file->commands().empty() ? file->commands().front() : ScenarioCommand{};
@@ -109,10 +109,10 @@ TEST(ScenarioFile, TellsTheFirstBadLineWithItsNumber) {
     };
     for (const char* line : bad) {
         const auto file = ScenarioFile::parse(QByteArray("# a comment\n\npress nnn.Command1\n") + line + "\nnonsense\n",
-                                              QStringLiteral("demo/a.scenario"));
+                                              u"demo/a.scenario"_s);
         ASSERT_FALSE(file.ok()) << line;
         EXPECT_TRUE(file.failure().message.startsWith(u"demo/a.scenario:4: ")) << file.failure().message.toStdString();
     }
-    EXPECT_FALSE(ScenarioFile::parse("type nnn.Text1 \xE9\xEA", QStringLiteral("s")).ok());
-    EXPECT_FALSE(ScenarioFile::load(QStringLiteral("/nowhere/a.scenario")).ok());
+    EXPECT_FALSE(ScenarioFile::parse("type nnn.Text1 \xE9\xEA", u"s"_s).ok());
+    EXPECT_FALSE(ScenarioFile::load(u"/nowhere/a.scenario"_s).ok());
 }

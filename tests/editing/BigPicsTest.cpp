@@ -10,6 +10,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // Left half and right half.
 Bitmap halves(int width, int height, QColor left, QColor right) {
     Bitmap picture(width, height, left);
@@ -21,10 +23,10 @@ Bitmap halves(int width, int height, QColor left, QColor right) {
 }
 
 TEST(SampleColorLevels, AddsOneZeroToWhatIsUnderAHundredSoThatTextOrderPutsTheBrightestLast) {
-    EXPECT_EQ(SampleColorLevels::itemText(0), QStringLiteral("00"));
-    EXPECT_EQ(SampleColorLevels::itemText(5), QStringLiteral("05"));
-    EXPECT_EQ(SampleColorLevels::itemText(50), QStringLiteral("050"));
-    EXPECT_EQ(SampleColorLevels::itemText(100), QStringLiteral("100"));
+    EXPECT_EQ(SampleColorLevels::itemText(0), u"00"_s);
+    EXPECT_EQ(SampleColorLevels::itemText(5), u"05"_s);
+    EXPECT_EQ(SampleColorLevels::itemText(50), u"050"_s);
+    EXPECT_EQ(SampleColorLevels::itemText(100), u"100"_s);
     EXPECT_LT(SampleColorLevels::itemText(5), SampleColorLevels::itemText(50));
     EXPECT_LT(SampleColorLevels::itemText(50), SampleColorLevels::itemText(200));
 
@@ -33,8 +35,8 @@ TEST(SampleColorLevels, AddsOneZeroToWhatIsUnderAHundredSoThatTextOrderPutsTheBr
     row.image().setPixelColor(5, 0, QColor(5, 0, 10));
     row.image().setPixelColor(10, 0, QColor(50, 0, 99));
     const SampleColorLevels samples(row, {0, 0, 10, 0});
-    EXPECT_EQ(samples.lists()[0], QStringList({QStringLiteral("05"), QStringLiteral("050"), QStringLiteral("200")}));
-    EXPECT_EQ(samples.lists()[2], QStringList({QStringLiteral("010"), QStringLiteral("09"), QStringLiteral("099")}));
+    EXPECT_EQ(samples.lists()[0], QStringList({u"05"_s, u"050"_s, u"200"_s}));
+    EXPECT_EQ(samples.lists()[2], QStringList({u"010"_s, u"09"_s, u"099"_s}));
 }
 
 TEST(SampleColorLevels, GivesTopLevelsGainsAndFloorsOfAFlatPicture) {
@@ -64,7 +66,7 @@ protected:
         chain.registerPage(PageId::Form3, [this] { return std::make_unique<Form3>(state, machine.platform, chain); });
     }
     QString picture(const char* name, const Bitmap& bitmap) {
-        const QString path = QStringLiteral("C:\\") + QString::fromLatin1(name);
+        const QString path = u"C:\\"_s + QString::fromLatin1(name);
         EXPECT_TRUE(bitmap.image().save(toText(*machine.drives.toHost(path)), "BMP"));
         return path;
     }
@@ -85,8 +87,8 @@ TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
     EXPECT_EQ(surfaces.Picture2.image().size(), QSize(400, 200));
     EXPECT_EQ(surfaces.Image_crop, QRect(50, 25, 300, 150));
     EXPECT_EQ(surfaces.List1.count(), 61 * 31);
-    EXPECT_EQ(surfaces.List1.item(0), QStringLiteral("020"));
-    EXPECT_EQ(surfaces.List3.item(surfaces.List3.lastIndex()), QStringLiteral("140"));
+    EXPECT_EQ(surfaces.List1.item(0), u"020"_s);
+    EXPECT_EQ(surfaces.List3.item(surfaces.List3.lastIndex()), u"140"_s);
     EXPECT_NEAR(surfaces.levels.gains[0], 255 / 220.2, 1e-4);
     EXPECT_EQ(surfaces.levels.floors, (ChannelValues{30, 50, 70}));
     EXPECT_EQ(surfaces.CipCip->workPicture().image(), before);
@@ -138,7 +140,7 @@ TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
     look.Command2_Click();
     EXPECT_TRUE(look.Picture2.isNull());
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages.first().contains(QStringLiteral("look.bmp")));
+    EXPECT_TRUE(machine.dialogs.messages.first().contains(u"look.bmp"_s));
     look.Command3_Click();
     EXPECT_EQ(chain.find(PageId::Form3), nullptr);
 }

@@ -6,6 +6,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(EditRecord, KeepsTheFirstFourCharactersOfAGain) {
     struct Case {
         int hundredths, steps;
@@ -23,7 +25,7 @@ TEST(EditRecord, KeepsTheFirstFourCharactersOfAGain) {
         EditFields edit;
         for (int step = 0; step < expected.steps; ++step)
             edit.GainR = EditStep::gain(edit.GainR, expected.hundredths);
-        PackEditState(edit, QStringLiteral("NB"), {});
+        PackEditState(edit, u"NB"_s, {});
         EXPECT_EQ(edit.EditState.left(4).toStdString(), expected.stored);
         EditFields back;
         UnpackEditState(edit.EditState, back);
@@ -37,15 +39,15 @@ TEST(EditRecord, CutsWhatIsTooLongForItsField) {
     edit.PanX = -1000;
     edit.TextFontSize = 100;
     edit.TextBody = QString(71, u'x');
-    PackEditState(edit, QStringLiteral("NB"), {});
+    PackEditState(edit, u"NB"_s, {});
     EXPECT_EQ(edit.EditState.size(), EditRecord::width);
-    EXPECT_EQ(edit.EditState.mid(12, 3), QStringLiteral("-10"));
-    EXPECT_EQ(edit.EditState.mid(18, 4), QStringLiteral("-100"));
-    EXPECT_EQ(edit.EditState.mid(54, 2), QStringLiteral("10"));
-    EXPECT_EQ(edit.EditState.mid(126), QString(70, u'x') + QStringLiteral("    "));
+    EXPECT_EQ(edit.EditState.mid(12, 3), u"-10"_s);
+    EXPECT_EQ(edit.EditState.mid(18, 4), u"-100"_s);
+    EXPECT_EQ(edit.EditState.mid(54, 2), u"10"_s);
+    EXPECT_EQ(edit.EditState.mid(126), QString(70, u'x') + u"    "_s);
     edit.TextFontSize = 0;
-    PackEditState(edit, QStringLiteral("NB"), {});
-    EXPECT_EQ(edit.EditState.mid(54, 2), QStringLiteral("0 "));
+    PackEditState(edit, u"NB"_s, {});
+    EXPECT_EQ(edit.EditState.mid(54, 2), u"0 "_s);
     UnpackEditState(edit.EditState, edit);
     EXPECT_EQ(edit.TextFontSize, 8);
 }
@@ -55,9 +57,9 @@ TEST(EditRecord, OfANewPictureThatWasOpenedHoldsTheCentreAndEveryField) {
     UnpackEditState(EditRecord::newPicture(), edit);
     edit.PanX = 225;
     edit.PanY = 150;
-    PackEditState(edit, QStringLiteral("NB"), QStringLiteral("blue"));
-    const QString start = QStringLiteral("1   1   1   180100225 150 0  0  000000000000") + QString(10, u' ') +
-                          QStringLiteral("8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 ");
+    PackEditState(edit, u"NB"_s, u"blue"_s);
+    const QString start = u"1   1   1   180100225 150 0  0  000000000000"_s + QString(10, u' ') +
+                          u"8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "_s;
     EXPECT_EQ(edit.EditState.toStdString(), start.leftJustified(EditRecord::width).toStdString());
 }
 
@@ -71,7 +73,7 @@ TEST(EditRecord, CarriesTheOrdersBorderAsAFrame) {
         EditFields edit;
         edit.FrameName = QString::fromLatin1(expected.frame);
         edit.FrameFolder = QString::fromLatin1(expected.folder);
-        PackEditState(edit, QString::fromLatin1(expected.border), QStringLiteral("blue"));
+        PackEditState(edit, QString::fromLatin1(expected.border), u"blue"_s);
         EXPECT_EQ(edit.FrameName.toStdString(), expected.frameAfter);
         EXPECT_EQ(edit.FrameFolder.toStdString(), expected.folderAfter);
     }

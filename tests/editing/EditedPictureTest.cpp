@@ -16,10 +16,12 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class EditedPictureTest : public testing::Test {
 protected:
     void SetUp() override {
-        ASSERT_TRUE(QDir(m_folder.path()).mkpath(QStringLiteral("frames/blue")));
+        ASSERT_TRUE(QDir(m_folder.path()).mkpath(u"frames/blue"_s));
         saveFrame("frames/blue/kab.bmp", Qt::green);
         saveFrame("frames/blue/ab.bmp", Qt::green);
         saveFrame("frames/blue/kcd.bmp", Qt::yellow);
@@ -131,7 +133,7 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
     }
     // What the measure is worth: a print that is moved, turned or toned a little differently is told from the preview.
     const auto differs = [&](const char* record) {
-        return meanDifference(preview("lying.png", fieldsOf(QStringLiteral("1   1   1   195150245 140 0  0  000"))),
+        return meanDifference(preview("lying.png", fieldsOf(u"1   1   1   195150245 140 0  0  000"_s)),
                               print("lying.png", fieldsOf(QString::fromLatin1(record))));
     };
     EXPECT_GT(differs("1   1   1   195150257 140 0  0  000"), 3.0);
@@ -140,7 +142,7 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
 }
 
 TEST_F(EditedPictureTest, aPreviewForALargerScreenIsTheSamePicture) {
-    const EditFields edit = fieldsOf(QStringLiteral("1   1   1.1 195150245 140 0  0  ab 000000000blue"));
+    const EditFields edit = fieldsOf(u"1   1   1.1 195150245 140 0  0  ab 000000000blue"_s);
     auto opened = EditedPreview::open(path("lying.png"), {10, 15}, 100, EditedPreview::Tone::Colour, 2);
     ASSERT_TRUE(opened);
     const auto frame = loadFrame(path("frames"), edit, FrameUse::Preview);
@@ -206,8 +208,8 @@ QRect darkBox(const Bitmap& paper) {
 
 QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double scale = 1) {
     PictureCaption caption;
-    caption.text = QStringLiteral("HHHH\r\nH");
-    caption.family = QStringLiteral("DejaVu Sans");
+    caption.text = u"HHHH\r\nH"_s;
+    caption.family = u"DejaVu Sans"_s;
     caption.emSize = 24;
     caption.align = align;
     caption.run = run;
@@ -247,12 +249,12 @@ TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
 
 TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
     PictureCaption caption;
-    caption.text = QStringLiteral("שלום Lumora 2024");
-    caption.family = QStringLiteral("No Such Family");
+    caption.text = u"שלום Lumora 2024"_s;
+    caption.family = u"No Such Family"_s;
     Bitmap paper(200, 60, Qt::white);
     drawInk(paper, inkOf(caption, {200, 60}));
     EXPECT_TRUE(darkBox(paper).isNull());
-    caption.family = QStringLiteral("David");
+    caption.family = u"David"_s;
     drawInk(paper, inkOf(caption, {200, 60}));
     EXPECT_FALSE(darkBox(paper).isNull());
 }
@@ -260,8 +262,8 @@ TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
 TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
     CaptionInks inks;
     PictureCaption caption;
-    caption.text = QStringLiteral("שלום Lumora\r\n2024");
-    caption.family = QStringLiteral("DejaVu Sans");
+    caption.text = u"שלום Lumora\r\n2024"_s;
+    caption.family = u"DejaVu Sans"_s;
     caption.emSize = 24;
     PaperScale scale;
     const std::function<void()> steps[] = {
@@ -279,9 +281,9 @@ TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
         [&] { caption.bold = true; },
         [&] { caption.emSize = 99; }, // larger than the paper: no longer kept
         [&] { caption.x = 60; },
-        [&] { caption.text = QStringLiteral("A"); },
-        [&] { caption.family = QStringLiteral("No Such Family"); },
-        [&] { caption.family = QStringLiteral("DejaVu Sans"); },
+        [&] { caption.text = u"A"_s; },
+        [&] { caption.family = u"No Such Family"_s; },
+        [&] { caption.family = u"DejaVu Sans"_s; },
     };
     for (std::size_t i = 0; i < std::size(steps); ++i) {
         steps[i]();

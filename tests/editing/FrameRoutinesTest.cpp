@@ -13,11 +13,13 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class FrameRoutines : public ::testing::Test {
 protected:
     FrameRoutines() {
         state.DiskRoot = machine.drives.programRoot();
-        EXPECT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora")).ok());
+        EXPECT_TRUE(machine.files.makeFolder(u"C:\\2000lumora"_s).ok());
     }
     QByteArray read(const QString& path) {
         const auto bytes = machine.files.read(path);
@@ -26,14 +28,14 @@ protected:
     void write(const QString& path, const QByteArray& bytes) {
         ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok());
     }
-    QStringList names(const QString& folder) { return machine.files.names(folder, QStringLiteral("*.*")); }
+    QStringList names(const QString& folder) { return machine.files.names(folder, u"*.*"_s); }
 
     TestPlatform machine;
     SessionState state;
-    const QString frame = QStringLiteral("C:\\frame.bmp");
-    const QString results = QStringLiteral("C:\\2000lumora\\!!moozpanim");
-    const QString pieces = QStringLiteral("C:\\2000lumora\\!!benaime");
-    const QString packed = results + QStringLiteral("\\!k.bmp");
+    const QString frame = u"C:\\frame.bmp"_s;
+    const QString results = u"C:\\2000lumora\\!!moozpanim"_s;
+    const QString pieces = u"C:\\2000lumora\\!!benaime"_s;
+    const QString packed = results + u"\\!k.bmp"_s;
 };
 
 const ChannelMinimums minimums{{1, 2.5F, 0.001F}, {-4, 0, 255}, {0.4F, 100000, 33.25F}};
@@ -59,7 +61,7 @@ TEST_F(FrameRoutines, ChannelMinimumsReadTheSameInAnyOrder) {
 
 TEST_F(FrameRoutines, ChannelMinimumsKeepWhatAFileDoesNotSay) {
     ChannelMinimums found = minimums;
-    ASSERT_TRUE(found.readFrom(machine.files, QStringLiteral("C:\\none.txt")).ok());
+    ASSERT_TRUE(found.readFrom(machine.files, u"C:\\none.txt"_s).ok());
     EXPECT_EQ(found, minimums);
     write(frame, "\"TKN.A_R_MIN(2)\",\"7.5 or so\"\r\n\"TKN.A_X_MIN(1)\",9\r\nno key\r\n\"TKN.A_R_MIN(4)\",9\r\n");
     ASSERT_TRUE(found.readFrom(machine.files, frame).ok());
@@ -91,7 +93,7 @@ TEST_F(FrameRoutines, ScramblingLeavesSmallFilesAloneAndClearsWhatAnInterruptedR
     EXPECT_FALSE(machine.files.folderExists(results));
 
     ASSERT_TRUE(machine.files.makeFolder(pieces).ok());
-    write(pieces + QStringLiteral("\\kzz.bmp"), "half a join");
+    write(pieces + u"\\kzz.bmp"_s, "half a join");
     write(frame, QByteArray(100'000, 'a'));
     ASSERT_TRUE(ScrambleFrameFile(state, machine.files, frame).ok());
     EXPECT_EQ(read(packed), QByteArray(100'000, 'a'));
@@ -99,7 +101,7 @@ TEST_F(FrameRoutines, ScramblingLeavesSmallFilesAloneAndClearsWhatAnInterruptedR
 }
 
 TEST_F(FrameRoutines, AScramblingThatFailsLosesNothing) {
-    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, QStringLiteral("C:\\none.bmp")).ok());
+    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, u"C:\\none.bmp"_s).ok());
     write(frame, QByteArray(120'000, 'a'));
     // A file stands where the folder should be.
     write(results, "in the way");
@@ -169,8 +171,7 @@ TEST(PaintLineFrame, DrawsTheStylesOfTheTableAndNoOthersOnABoxOfAnySize) {
     for (const QSize size : {QSize(300, 450), QSize(7, 3), QSize(1, 1)}) {
         for (int style = 1; style <= 60; ++style) {
             const bool drawn = style <= 6 || (style >= 13 && style <= 19) || (style >= 21 && style <= 50);
-            const QImage image =
-                lineFrame(QStringLiteral("W%1").arg(style, 2, 10, QLatin1Char('0')), size.width(), size.height());
+            const QImage image = lineFrame(u"W%1"_s.arg(style, 2, 10, QLatin1Char('0')), size.width(), size.height());
             const QImage plain = Bitmap(size.width(), size.height(), Qt::black).image();
             if (!drawn || size.width() == 300) {
                 EXPECT_EQ(image != plain, drawn) << style;
@@ -180,8 +181,8 @@ TEST(PaintLineFrame, DrawsTheStylesOfTheTableAndNoOthersOnABoxOfAnySize) {
 }
 
 TEST(PaintLineFrame, TakesTheColourOfItsLetter) {
-    EXPECT_EQ(lineFrame(QStringLiteral("S03")).pixelColor(0, 150), QColor(240, 120, 0));
-    EXPECT_EQ(lineFrame(QStringLiteral("T03")).pixelColor(0, 150), QColor(0, 250, 250));
+    EXPECT_EQ(lineFrame(u"S03"_s).pixelColor(0, 150), QColor(240, 120, 0));
+    EXPECT_EQ(lineFrame(u"T03"_s).pixelColor(0, 150), QColor(0, 250, 250));
 }
 
 } // namespace

@@ -8,6 +8,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 using Pixels = std::map<std::pair<int, int>, QRgb>;
 
 // Skin with a red pupil, a catch-light and shades between.
@@ -41,7 +43,7 @@ TEST(RedEye, GreysMorePixelsTheDeeperTheLevel) {
         const QStringList changed = RedEye::correct(picture, {0, 0, 9, 9}, peak.ratio(), expected.level);
         EXPECT_EQ(changed.size(), static_cast<qsizetype>(expected.grey.size()));
         if (expected.level == 0) {
-            EXPECT_EQ(changed.join(u' '), QStringLiteral("0^0 2^6 4^4 5^4"));
+            EXPECT_EQ(changed.join(u' '), u"0^0 2^6 4^4 5^4"_s);
         }
         for (int y = 0; y < 9; ++y) {
             for (int x = 0; x < 9; ++x) {
@@ -63,7 +65,7 @@ TEST(RedEye, FindsNoPeakWithoutRed) {
 
 TEST(RedEye, DarkensDownToFiveAndPassesOverPointsOutside) {
     Bitmap picture(3, 3, QColor(7, 5, 200));
-    RedEye::darken(picture, {1, 1, 2, 2}, {QStringLiteral("0^0"), QStringLiteral("5^5")});
+    RedEye::darken(picture, {1, 1, 2, 2}, {u"0^0"_s, u"5^5"_s});
     EXPECT_EQ(picture.image().pixel(1, 1), qRgb(2, 5, 195));
     EXPECT_EQ(picture.image().pixel(0, 0), qRgb(7, 5, 200));
 }

@@ -18,20 +18,22 @@
 
 namespace lumora {
 
-inline const QString lying = QStringLiteral("C:\\p\\lying.jpg");
-inline const QString standing = QStringLiteral("C:\\p\\standing.jpg");
+using namespace Qt::StringLiterals;
+
+inline const QString lying = u"C:\\p\\lying.jpg"_s;
+inline const QString standing = u"C:\\p\\standing.jpg"_s;
 
 // The editor on a fresh drive with two red pictures. stored: the records that it gave away since a picture was opened.
 class TheEditor : public testing::Test {
 protected:
     TheEditor()
         : chain(machine.pump) {
-        state.DiskRoot = QStringLiteral("C:\\");
+        state.DiskRoot = u"C:\\"_s;
         state.Optint = 2;
-        state.shemot.ppr = QStringLiteral("10/15");
-        state.shemot.Bord = QStringLiteral("NB");
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.Bord = u"NB"_s;
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
-        EXPECT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\p")));
+        EXPECT_TRUE(machine.files.makeFolder(u"C:\\p"_s));
         savePicture(lying, {400, 300}, Qt::red);
         savePicture(standing, {300, 400}, Qt::red);
         chain.registerPage(PageId::tFrmNew,
@@ -50,8 +52,7 @@ protected:
     void makeFrame(const QString& category, const QString& name, QColor colour) {
         const QString folder = JoinDrivePath(WorkspacePaths::misgarot(state), category);
         EXPECT_TRUE(machine.files.makeFolder(folder));
-        for (const QString& leaf :
-             {u'k' + name + QStringLiteral(".bmp"), name + QStringLiteral(".bmp"), name + QStringLiteral(".png")})
+        for (const QString& leaf : {u'k' + name + u".bmp"_s, name + u".bmp"_s, name + u".png"_s})
             EXPECT_TRUE(Bitmap(30, 20, colour).image().save(toText(host(JoinDrivePath(folder, leaf)))));
     }
 

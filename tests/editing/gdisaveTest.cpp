@@ -10,14 +10,16 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class SavingPictures : public ::testing::Test {
 protected:
     SavingPictures()
         : chain(machine.pump) {
         state.DiskRoot = machine.drives.programRoot();
-        state.transfer.OrderFolder = QStringLiteral("C:\\2000lumora\\!!000\\order");
-        state.MisparHazmana = QStringLiteral("105");
-        state.shemot.ser = QStringLiteral("1234");
+        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000\\order"_s;
+        state.MisparHazmana = u"105"_s;
+        state.shemot.ser = u"1234"_s;
         std::filesystem::create_directories(*machine.drives.toHost(state.transfer.OrderFolder));
         chain.registerPage(PageId::gdisave, [this] {
             auto page = std::make_unique<gdisave>(state, machine.platform, chain, [this] { return startStatus; });
@@ -33,7 +35,7 @@ protected:
         return found && *found == size;
     }
     static QString sheet(const char* extension) {
-        return QStringLiteral("C:\\2000lumora\\!!000\\order\\!105_1234") + QString::fromLatin1(extension);
+        return u"C:\\2000lumora\\!!000\\order\\!105_1234"_s + QString::fromLatin1(extension);
     }
 
     int startStatus = 0;
@@ -45,8 +47,8 @@ protected:
 TEST_F(SavingPictures, eachButtonSavesItsPictureUnderItsName) {
     page().Command5_Click();
     page().Command7_Click();
-    EXPECT_TRUE(isPicture(QStringLiteral("C:\\2000lumora\\!!000\\^^^.jpg"), {20, 10}));
-    EXPECT_TRUE(isPicture(QStringLiteral("C:\\2000lumora\\000.jpg"), {8, 6}));
+    EXPECT_TRUE(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_s, {20, 10}));
+    EXPECT_TRUE(isPicture(u"C:\\2000lumora\\000.jpg"_s, {8, 6}));
     EXPECT_TRUE(machine.dialogs.messages.isEmpty());
 }
 
@@ -72,25 +74,25 @@ TEST_F(SavingPictures, doesNothingWhenTheDrawingDidNotStart) {
     page().Command5_Click();
     page().Command6_Click();
     page().Command7_Click();
-    EXPECT_EQ(machine.dialogs.messages, QStringList({QStringLiteral("Gdiplus Not Initialized. GDI+ Error:18"),
-                                                     QStringLiteral("GDI+ not inizialized.")}));
-    EXPECT_EQ(machine.dialogs.titles, QStringList({QStringLiteral("GDI Error"), QStringLiteral("GDI Error")}));
-    EXPECT_TRUE(machine.files.names(QStringLiteral("C:\\2000lumora\\!!000"), QStringLiteral("*.*")).isEmpty());
-    EXPECT_TRUE(machine.files.names(QStringLiteral("C:\\2000lumora"), QStringLiteral("*.*")).isEmpty());
+    EXPECT_EQ(machine.dialogs.messages,
+              QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
+    EXPECT_EQ(machine.dialogs.titles, QStringList({u"GDI Error"_s, u"GDI Error"_s}));
+    EXPECT_TRUE(machine.files.names(u"C:\\2000lumora\\!!000"_s, u"*.*"_s).isEmpty());
+    EXPECT_TRUE(machine.files.names(u"C:\\2000lumora"_s, u"*.*"_s).isEmpty());
 }
 
 TEST_F(SavingPictures, tellsWhyAPictureCouldNotBeSavedAndGoesOn) {
-    EXPECT_FALSE(page().SaveJpeg(page().PicPic, QStringLiteral("C:\\missing\\a.jpg"), 90));
+    EXPECT_FALSE(page().SaveJpeg(page().PicPic, u"C:\\missing\\a.jpg"_s, 90));
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages[0].startsWith(QStringLiteral("File Not Found. GDI+ Error:10\n")));
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(QStringLiteral("C:\\missing\\a.jpg")));
-    EXPECT_FALSE(page().SaveJpeg({}, QStringLiteral("C:\\2000lumora\\a.jpg"), 90));
-    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\a.jpg")));
+    EXPECT_TRUE(machine.dialogs.messages[0].startsWith(u"File Not Found. GDI+ Error:10\n"_s));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"C:\\missing\\a.jpg"_s));
+    EXPECT_FALSE(page().SaveJpeg({}, u"C:\\2000lumora\\a.jpg"_s, 90));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\a.jpg"_s));
 }
 
 TEST_F(SavingPictures, holdsTheQualityWithinItsRange) {
     const auto savedAt = [this](int quality) {
-        const QString path = QStringLiteral("C:\\2000lumora\\q.jpg");
+        const QString path = u"C:\\2000lumora\\q.jpg"_s;
         EXPECT_TRUE(page().SaveJpeg(page().PicPic, path, quality));
         return *machine.files.read(path);
     };
@@ -99,19 +101,19 @@ TEST_F(SavingPictures, holdsTheQualityWithinItsRange) {
     EXPECT_NE(savedAt(0), savedAt(100));
     page().HScroll1_Change(150);
     EXPECT_EQ(page().HScroll1, 100);
-    EXPECT_EQ(page().Label1.text, QStringLiteral("איכות: 100"));
+    EXPECT_EQ(page().Label1.text, u"איכות: 100"_s);
 }
 
 TEST_F(SavingPictures, knowsTheStatusTextsAndTheEncoder) {
-    EXPECT_EQ(gdisave::GdiStatusText(1), QStringLiteral("Generic Error."));
-    EXPECT_EQ(gdisave::GdiStatusText(17), QStringLiteral("Unsupported Gdiplus Version."));
-    EXPECT_EQ(gdisave::GdiStatusText(20), QStringLiteral("Property Not Supported."));
+    EXPECT_EQ(gdisave::GdiStatusText(1), u"Generic Error."_s);
+    EXPECT_EQ(gdisave::GdiStatusText(17), u"Unsupported Gdiplus Version."_s);
+    EXPECT_EQ(gdisave::GdiStatusText(20), u"Property Not Supported."_s);
     for (const int unknown : {21, -1, 1000})
-        EXPECT_EQ(gdisave::GdiStatusText(unknown), QStringLiteral("Unknown GDI+ Error."));
+        EXPECT_EQ(gdisave::GdiStatusText(unknown), u"Unknown GDI+ Error."_s);
     EXPECT_EQ(page().ShowGdiStatus(0), 0);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty());
-    EXPECT_TRUE(gdisave::FindEncoderClsid(QStringLiteral("IMAGE/JPEG")));
-    EXPECT_FALSE(gdisave::FindEncoderClsid(QStringLiteral("image/webp")));
+    EXPECT_TRUE(gdisave::FindEncoderClsid(u"IMAGE/JPEG"_s));
+    EXPECT_FALSE(gdisave::FindEncoderClsid(u"image/webp"_s));
 }
 
 } // namespace

@@ -5,23 +5,25 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
     page();
     EXPECT_TRUE(stored.isEmpty());
     tFrmNew& editor = open(lying);
-    EXPECT_EQ(state.edit.EditState, LeftField(QStringLiteral("1   1   1   180100225 150 0  0  000000000000          "
-                                                             "8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "),
+    EXPECT_EQ(state.edit.EditState, LeftField(u"1   1   1   180100225 150 0  0  000000000000          "
+                                              "8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "_s,
                                               200));
     EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
     EXPECT_EQ(editor.PicPic.width(), 450);
     EXPECT_GT(middle().red(), 240);
     EXPECT_TRUE(editor.Picture3.visible);
     EXPECT_FALSE(editor.Image19.visible);
-    EXPECT_EQ(*readPictureSize(host(QStringLiteral("C:\\2000lumora\\0.bmp"))), (PictureSize{500, 375}));
+    EXPECT_EQ(*readPictureSize(host(u"C:\\2000lumora\\0.bmp"_s)), (PictureSize{500, 375}));
 
     // 780 is a position, 781 is none.
     for (const auto& [pan, expected] : {std::pair(780, 780), std::pair(781, 225)}) {
-        open(lying, recordWith(EditRecord::PanX, QString::number(pan)).replace(22, 4, QStringLiteral("20  ")));
+        open(lying, recordWith(EditRecord::PanX, QString::number(pan)).replace(22, 4, u"20  "_s));
         EXPECT_EQ(state.edit.PanX, expected);
         EXPECT_EQ(state.edit.PanY, expected == 780 ? 20 : 150);
     }
@@ -33,17 +35,17 @@ TEST_F(TheEditor, countsTheTicksOfItsHeldButtonsIntoTheRecord) {
     held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 15);
     held([&] { editor.Image135_MouseDown(); }, [&] { editor.Timer7_Tick(); }, [&] { editor.Image135_MouseUp(); }, 10);
     held([&] { editor.Image125_MouseDown(); }, [&] { editor.Timer8_Tick(); }, [&] { editor.Image125_MouseUp(); }, 5);
-    EXPECT_EQ(stored.last().mid(12, 14), QStringLiteral("195150245 140 "));
+    EXPECT_EQ(stored.last().mid(12, 14), u"195150245 140 "_s);
 
     chain.unload(PageId::tFrmNew);
-    state.shemot.ppr = QStringLiteral("13/18");
+    state.shemot.ppr = u"13/18"_s;
     tFrmNew& second = open(standing);
     EXPECT_EQ(second.PicPicSize, (PictureSize{300, 415}));
     holdImage2(1, 10);
     second.Image15_Click();
     held([&] { second.Image115_MouseDown(); }, [&] { second.Timer7_Tick(); }, [&] { second.Image115_MouseUp(); }, 10);
     held([&] { second.Image145_MouseDown(); }, [&] { second.Timer8_Tick(); }, [&] { second.Image145_MouseUp(); }, 5);
-    EXPECT_EQ(stored.last().mid(12, 14), QStringLiteral("27080 130 217 "));
+    EXPECT_EQ(stored.last().mid(12, 14), u"27080 130 217 "_s);
 }
 
 TEST_F(TheEditor, storesAGainByItsFirstFourCharacters) {
@@ -70,7 +72,7 @@ TEST_F(TheEditor, storesAGainByItsFirstFourCharacters) {
     holdImage2(4, 5);
     page().Image2_Click(6);
     page().Image2_Click(8);
-    EXPECT_EQ(stored.last().left(12), QStringLiteral("1.2 1.2 1.2 "));
+    EXPECT_EQ(stored.last().left(12), u"1.2 1.2 1.2 "_s);
 }
 
 TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
@@ -79,16 +81,16 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     editor.Timer2_Tick();
     editor.Timer2_Tick();
     EXPECT_EQ(state.edit.ZoomPercent, 104);
-    EXPECT_EQ(editor.Label11.text, QStringLiteral("104"));
-    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("100"));
+    EXPECT_EQ(editor.Label11.text, u"104"_s);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"100"_s);
     EXPECT_TRUE(stored.isEmpty());
     editor.Image2_MouseUp(0);
     ASSERT_EQ(stored.size(), 1);
-    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("104"));
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"104"_s);
 
     editor.Image2_MouseDown(4);
     editor.Timer3_Tick();
-    EXPECT_EQ(field(EditRecord::GainR), QStringLiteral("1.04"));
+    EXPECT_EQ(field(EditRecord::GainR), u"1.04"_s);
     EXPECT_EQ(stored.size(), 1);
     editor.Image2_MouseUp(4);
     EXPECT_EQ(stored.size(), 2);
@@ -104,7 +106,7 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     EXPECT_EQ(stored.size(), 5);
 
     state.edit.TextOn = 1;
-    state.edit.TextBody = QStringLiteral("abc");
+    state.edit.TextBody = u"abc"_s;
     state.edit.TextX = state.edit.TextY = 100;
     editor.Command11_Click();
     ASSERT_EQ(stored.size(), 6);
@@ -117,7 +119,7 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     ASSERT_EQ(stored.size(), 7);
     EXPECT_EQ(stored[6], stored[5]); // the place waits for the next pack
     editor.Command5_Click();
-    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("103"));
+    EXPECT_EQ(field(EditRecord::TextX), u"103"_s);
 }
 
 TEST_F(TheEditor, holdsItsNumbersWithinTheirRanges) {
@@ -132,23 +134,23 @@ TEST_F(TheEditor, holdsItsNumbersWithinTheirRanges) {
 
     state.edit.RotationCode = 500;
     editor.Image15_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("230"));
+    EXPECT_EQ(field(EditRecord::RotationCode), u"230"_s);
     editor.Image18_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("500"));
+    EXPECT_EQ(field(EditRecord::RotationCode), u"500"_s);
     state.edit.RotationCode = 540;
     held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 1);
-    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("180"));
+    EXPECT_EQ(field(EditRecord::RotationCode), u"180"_s);
     held([&] { editor.Image17_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image17_MouseUp(); }, 3);
-    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("177"));
+    EXPECT_EQ(field(EditRecord::RotationCode), u"177"_s);
     editor.Image27_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), QStringLiteral("180"));
+    EXPECT_EQ(field(EditRecord::RotationCode), u"180"_s);
 
     state.edit.PanX = 32767;
-    open(lying, recordWith(EditRecord::PanX, QStringLiteral("780")).replace(22, 4, QStringLiteral("-999")));
+    open(lying, recordWith(EditRecord::PanX, u"780"_s).replace(22, 4, u"-999"_s));
     state.edit.PanY = -999;
     held([&] { page().Image125_MouseDown(); }, [&] { page().Timer8_Tick(); }, [&] { page().Image125_MouseUp(); }, 1);
     EXPECT_EQ(state.edit.PanY, -1001);
-    EXPECT_EQ(field(EditRecord::PanY), QStringLiteral("-100"));
+    EXPECT_EQ(field(EditRecord::PanY), u"-100"_s);
 }
 
 TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
@@ -162,7 +164,7 @@ TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
     EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
     editor.PicPic_MouseUp();
     editor.PicPic_MouseMove({300, 300});
-    EXPECT_EQ(stored.last().mid(18, 8), QStringLiteral("227 150 ")); // 226.6, and 149.5 to the even one
+    EXPECT_EQ(stored.last().mid(18, 8), u"227 150 "_s); // 226.6, and 149.5 to the even one
     ASSERT_EQ(stored.size(), 1);
 
     editor.Command8_Click();
@@ -181,7 +183,7 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
     editor.stopHolds();
     EXPECT_EQ(editor.sunkImage2, -1);
     ASSERT_EQ(stored.size(), 1);
-    EXPECT_EQ(stored[0].mid(15, 3), QStringLiteral("102"));
+    EXPECT_EQ(stored[0].mid(15, 3), u"102"_s);
     editor.Timer2_Tick(); // one that was under way
     EXPECT_EQ(state.edit.ZoomPercent, 102);
 
@@ -195,7 +197,7 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
     editor.Image2_MouseDown(0);
     editor.Timer2_Tick();
     chain.show(PageId::kyoskNew);
-    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("106"));
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"106"_s);
     editor.Timer2_Tick();
     EXPECT_EQ(state.edit.ZoomPercent, 106);
 
@@ -206,7 +208,7 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
     stored.clear();
     editor.Command17_Click();
     ASSERT_EQ(stored.size(), 1);
-    EXPECT_TRUE(stored.last().contains(QStringLiteral("180100150 225 ")));
+    EXPECT_TRUE(stored.last().contains(u"180100150 225 "_s));
     stored.clear();
     editor.Image2_MouseUp(0);
     EXPECT_EQ(state.edit.ZoomPercent, 100);
@@ -241,22 +243,21 @@ TEST_F(TheEditor, greysThePictureOnceWhateverTonesFollow) {
         EXPECT_TRUE(near(middle(), c.colour)) << c.gains;
         EXPECT_EQ(stored.last().left(12), QString::fromLatin1(c.gains));
     }
-    const QString sepia = recordWith(EditRecord::ToneFlag, QStringLiteral("1")).replace(0, 4, QStringLiteral("1.3 "));
+    const QString sepia = recordWith(EditRecord::ToneFlag, u"1"_s).replace(0, 4, u"1.3 "_s);
     open(lying, sepia);
     EXPECT_TRUE(near(middle(), QColor(99, 76, 76)));
     editor.Image4_Click();
     EXPECT_TRUE(near(middle(), QColor(76, 76, 76)));
     editor.Image5_Click();
     EXPECT_GT(middle().red(), 240);
-    EXPECT_EQ(field(EditRecord::ToneFlag), QStringLiteral("0  "));
+    EXPECT_EQ(field(EditRecord::ToneFlag), u"0  "_s);
 }
 
 TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
     const QString copy = JoinDrivePath(WorkspacePaths::tempred(state), MangleFileName(lying));
     ASSERT_TRUE(Bitmap(400, 300, Qt::blue).image().save(toText(host(copy)), "BMP"));
-    const QString before = recordWith(EditRecord::RedMarker, QStringLiteral("RED"))
-                               .replace(32, 3, QStringLiteral("017"))
-                               .replace(126, 4, QStringLiteral("Dana"));
+    const QString before =
+        recordWith(EditRecord::RedMarker, u"RED"_s).replace(32, 3, u"017"_s).replace(126, 4, u"Dana"_s);
     tFrmNew& editor = open(lying, before);
     EXPECT_GT(middle().blue(), 240);
     editor.Image4_Click();
@@ -266,28 +267,28 @@ TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
     EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
     editor.Image2_Click(5);
     EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 325}));
-    EXPECT_EQ(stored.last().left(44), QStringLiteral("1   1   1   180100225 162 0  0  017000RED000"));
-    EXPECT_EQ(field(EditRecord::TextBody).trimmed(), QStringLiteral("Dana"));
+    EXPECT_EQ(stored.last().left(44), u"1   1   1   180100225 162 0  0  017000RED000"_s);
+    EXPECT_EQ(field(EditRecord::TextBody).trimmed(), u"Dana"_s);
     EXPECT_GT(middle().blue(), 240);
 
     // Back to colour shows the customer's own file, and the record keeps its marker.
     editor.Image5_Click();
     EXPECT_GT(middle().red(), 240);
-    EXPECT_EQ(field(EditRecord::RedMarker), QStringLiteral("RED"));
+    EXPECT_EQ(field(EditRecord::RedMarker), u"RED"_s);
 
     // A corrected copy that is gone leaves the picture without it.
     ASSERT_TRUE(machine.files.removeFile(copy));
     open(lying, before);
     EXPECT_GT(middle().red(), 240);
-    EXPECT_EQ(field(EditRecord::RedMarker), QStringLiteral("000"));
+    EXPECT_EQ(field(EditRecord::RedMarker), u"000"_s);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages.value(0).contains(copy));
 }
 
 TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\p\\bad.jpg"), "no picture"));
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\bad.jpg"_s, "no picture"));
     open(lying);
-    tFrmNew& editor = open(QStringLiteral("C:\\p\\bad.jpg"));
+    tFrmNew& editor = open(u"C:\\p\\bad.jpg"_s);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_FALSE(editor.pictureOpen());
     EXPECT_TRUE(editor.PicPic.isNull());
@@ -313,7 +314,7 @@ TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
 }
 
 TEST_F(TheEditor, readsBadRecordsAsThePictureWithoutThatEdit) {
-    makeFrame(QStringLiteral("simple"), QStringLiteral("003"), Qt::green);
+    makeFrame(u"simple"_s, u"003"_s, Qt::green);
     struct Case {
         EditRecord::Column column;
         const char* value;
@@ -323,8 +324,7 @@ TEST_F(TheEditor, readsBadRecordsAsThePictureWithoutThatEdit) {
           Case{EditRecord::RotationCode, "?"}, Case{EditRecord::FrameFolder, ".."},
           Case{EditRecord::FrameFolder, "\\p"}, Case{EditRecord::ToneFlag, "x"}, Case{EditRecord::GainG, "eee"},
           Case{EditRecord::GainR, "x1"}, Case{EditRecord::ZoomPercent, "o8"}, Case{EditRecord::GainB, "-.x"}}) {
-        tFrmNew& editor =
-            open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, QStringLiteral("003")));
+        tFrmNew& editor = open(lying, recordWith(c.column, QString::fromLatin1(c.value)).replace(32, 3, u"003"_s));
         EXPECT_TRUE(editor.pictureOpen()) << c.value;
         EXPECT_LT(corner().green(), 100) << c.value;
         EXPECT_GT(middle().red(), 200) << c.value;
@@ -351,7 +351,7 @@ TEST_F(TheEditor, placesTheCaptionsBoxAndFindsTheAnchorBack) {
     fields.TextX = 200;
     fields.TextY = 150;
     fields.TextFontSize = 24;
-    fields.TextBody = QStringLiteral("twelve signs");
+    fields.TextBody = u"twelve signs"_s;
     const double width = TextLabelPlace::boxOf(fields).width;
     EXPECT_NEAR(width, 12 * 12, 24);
     EXPECT_EQ(TextLabelPlace::blanks(fields).size(), 24);
@@ -380,11 +380,11 @@ TEST_F(TheEditor, beginsACaptionAndHandsItToTheKeyboard) {
     EXPECT_TRUE(editor.Labeltext.visible);
     EXPECT_EQ(state.edit.TextFontSize, 24);
     EXPECT_TRUE(static_cast<mikledet&>(*chain.front()).Check4.checked);
-    state.edit.TextBody = QStringLiteral("Dana");
+    state.edit.TextBody = u"Dana"_s;
     editor.Command11_Click();
-    EXPECT_EQ(stored.last().mid(54, 8), QStringLiteral("240 0 0 "));
-    EXPECT_EQ(stored.last().mid(74, 15), QStringLiteral("30 255255100100"));
-    EXPECT_EQ(stored.last().mid(126, 4), QStringLiteral("Dana"));
+    EXPECT_EQ(stored.last().mid(54, 8), u"240 0 0 "_s);
+    EXPECT_EQ(stored.last().mid(74, 15), u"30 255255100100"_s);
+    EXPECT_EQ(stored.last().mid(126, 4), u"Dana"_s);
     editor.CommandDone_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(chain.find(PageId::mikledet), nullptr);
@@ -413,7 +413,7 @@ TEST_F(TheEditor, showsCropMarkersThatStayAParallelogramAndCutNothing) {
 }
 
 TEST_F(TheEditor, tellsOnceThatTheWorkPictureCannotBeWritten) {
-    ASSERT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora\\0.bmp")));
+    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\0.bmp"_s));
     open(lying);
     open(standing);
     EXPECT_TRUE(page().pictureOpen());
@@ -436,7 +436,7 @@ TEST_F(TheEditor, keepsTheSmallViewInLogicalPixelsHoweverSharpTheScreen) {
 TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
     open(lying);
     page().Command6_Click();
-    EXPECT_EQ(stored.last().mid(41, 3), QStringLiteral("111"));
+    EXPECT_EQ(stored.last().mid(41, 3), u"111"_s);
     auto& surfaces = static_cast<BigPics&>(chain.load(PageId::BigPics));
     EXPECT_FALSE(surfaces.List1.isEmpty());
     surfaces.List1.clear();
@@ -459,20 +459,20 @@ TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(state.edit.EditState, before);
     EXPECT_EQ(machine.dialogs.pickRequests.size(), 2);
-    EXPECT_TRUE(machine.dialogs.pickRequests[0].endsWith(QStringLiteral("בחר תמונה אחת וכל התמונות תוצגנה")));
+    EXPECT_TRUE(machine.dialogs.pickRequests[0].endsWith(u"בחר תמונה אחת וכל התמונות תוצגנה"_s));
 }
 
 TEST_F(TheEditor, speaksTheLanguageOfTheSession) {
     tFrmNew& editor = page();
-    EXPECT_EQ(editor.Command8.text, QStringLiteral("Text כיתוב"));
-    EXPECT_EQ(editor.Combo5.text, QStringLiteral("מיסגרות"));
-    EXPECT_EQ(editor.Image2[0].hint, QStringLiteral("זום התקרב= לחיצה ממושכת על העכבר = "));
-    EXPECT_EQ(editor.Image17.hint, QStringLiteral("סובב לשמאל = לחיצה ממושכת על העכבר = "));
+    EXPECT_EQ(editor.Command8.text, u"Text כיתוב"_s);
+    EXPECT_EQ(editor.Combo5.text, u"מיסגרות"_s);
+    EXPECT_EQ(editor.Image2[0].hint, u"זום התקרב= לחיצה ממושכת על העכבר = "_s);
+    EXPECT_EQ(editor.Image17.hint, u"סובב לשמאל = לחיצה ממושכת על העכבר = "_s);
     EXPECT_TRUE(editor.Image15.hint.isEmpty());
     state.EnglishTips = 1;
     editor.setTexts();
-    EXPECT_EQ(editor.Command8.text, QStringLiteral("Add text"));
-    EXPECT_EQ(editor.Combo5.text, QStringLiteral("Frames"));
+    EXPECT_EQ(editor.Command8.text, u"Add text"_s);
+    EXPECT_EQ(editor.Combo5.text, u"Frames"_s);
 }
 
 } // namespace

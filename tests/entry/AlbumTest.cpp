@@ -7,10 +7,12 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 using Panel = AlbumPanels::Panel;
 
 constexpr int albumTile = 6;
-const QString photographerStore = QStringLiteral("C:\\2000lumora\\pratim2.txt");
+const QString photographerStore = u"C:\\2000lumora\\pratim2.txt"_s;
 
 class AlbumTest : public DetailsPageTest {
 protected:
@@ -23,7 +25,7 @@ protected:
         const char* const typed[] = {" Studio Or ", "03-7654321", "Noa's wedding", "studio"};
         for (int i = 0; i < 4; ++i)
             album.Text1_Change(i, QString::fromLatin1(typed[i]));
-        album.Combo4Mail_Change(QStringLiteral("example.com"));
+        album.Combo4Mail_Change(u"example.com"_s);
     }
     // All that an order needs, as far as the bill, with the terms ticked.
     nnn& atBill() {
@@ -51,7 +53,7 @@ protected:
 };
 
 TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
-    state.album.HearotLBM = QStringLiteral("of an album before");
+    state.album.HearotLBM = u"of an album before"_s;
     nnn& page = atBill();
     EXPECT_EQ(page.step, nnn::Step::Album);
     EXPECT_EQ(page.album.panel, Panel::Bill);
@@ -257,7 +259,7 @@ TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
     chain.unload(PageId::nnn);
 
     nnn& second = start();
-    second.album.Text1_Change(2, QStringLiteral("Another event"));
+    second.album.Text1_Change(2, u"Another event"_s);
     second.album.Command28_Click();
     EXPECT_EQ(second.album.Text1[0].text, u" Studio Or ");
     EXPECT_EQ(second.album.Text1[1].text, u"03-7654321");
@@ -274,7 +276,7 @@ TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
 TEST_F(AlbumTest, TheAlbumsEndRulesWhetherTheCustomersDetailsStay) {
     for (const bool remember : {true, false}) {
         nnn& page = atBill();
-        page.Text2_Change(QStringLiteral("Dana Levi"));
+        page.Text2_Change(u"Dana Levi"_s);
         page.Check2_Click(remember);
         page.album.Command22_Click();
         EXPECT_EQ(machine.files.fileExists(customerStore), remember);
@@ -284,12 +286,12 @@ TEST_F(AlbumTest, TheAlbumsEndRulesWhetherTheCustomersDetailsStay) {
 
 TEST_F(AlbumTest, AWholeAddressInTheFirstBoxIsTakenAsItIs) {
     nnn& page = atBill();
-    page.album.Text1_Change(3, QStringLiteral("studio@lab.example"));
+    page.album.Text1_Change(3, u"studio@lab.example"_s);
     page.album.Command23_Click();
     EXPECT_EQ(state.album.MailZalam, u"studio@lab.example@example.com") << "a domain was chosen";
     chain.unload(PageId::nnn);
     nnn& again = start();
-    again.album.Text1_Change(3, QStringLiteral("studio@lab.example"));
+    again.album.Text1_Change(3, u"studio@lab.example"_s);
     again.album.Command23_Click();
     EXPECT_EQ(state.album.MailZalam, u"studio@lab.example");
 }

@@ -14,12 +14,14 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // The details page with bare pages on both sides of it.
 class DetailsPageTest : public ::testing::Test {
 protected:
     DetailsPageTest() {
         state.DiskRoot = machine.drives.programRoot();
-        state.KodMishloach = QStringLiteral("KUP");
+        state.KodMishloach = u"KUP"_s;
         for (const PageId id : {PageId::hatchala, PageId::kyoskNew, PageId::MoogMeret})
             chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
         chain.registerPage(PageId::Havharot,
@@ -34,7 +36,7 @@ protected:
         return static_cast<nnn&>(*chain.front());
     }
 
-    const QString customerStore = QStringLiteral("C:\\2000lumora\\pratim.txt");
+    const QString customerStore = u"C:\\2000lumora\\pratim.txt"_s;
     TestPlatform machine;
     SessionState state;
     Deployment deployment;

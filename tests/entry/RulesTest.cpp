@@ -14,6 +14,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
     const struct {
         QString letter;
@@ -45,28 +47,27 @@ TEST(TileMenuTest, NamesTheBordersByTheirCodes) {
 }
 
 TEST(TimeOfJobTest, HasDayCodeAndVolumeInFixedPlaces) {
-    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), QStringLiteral("KUP"), QStringLiteral("1234")),
-              u"2026_11_21_KUP_1234^");
-    EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), QStringLiteral("P"), QString()), u"0987_01_02_P  _^");
-    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), QStringLiteral("LONG"), QStringLiteral("7")), u"2026_01_02_LON_7^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), u"KUP"_s, u"1234"_s), u"2026_11_21_KUP_1234^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), u"P"_s, QString()), u"0987_01_02_P  _^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), u"LONG"_s, u"7"_s), u"2026_01_02_LON_7^");
 }
 
 TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
     FixedVolume volume;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, QStringLiteral("C:\\"))), u"1234");
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_s)), u"1234");
     volume.number = -12;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, QStringLiteral("C:\\"))), u"-12");
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_s)), u"-12");
     volume.fails = true;
-    EXPECT_FALSE(ReadVolumeSerial(volume, QStringLiteral("C:\\")).ok());
+    EXPECT_FALSE(ReadVolumeSerial(volume, u"C:\\"_s).ok());
 }
 
 TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
     using Place = DetailsProblem::Place;
     SessionState good;
-    takeDetails(good, QStringLiteral(" Dana Levi "), QStringLiteral("call me"), QString());
-    good.shemot.ppr = QStringLiteral("10/15");
-    good.shemot.maat = QStringLiteral("מט");
-    good.shemot.Bord = QStringLiteral("NB");
+    takeDetails(good, u" Dana Levi "_s, u"call me"_s, QString());
+    good.shemot.ppr = u"10/15"_s;
+    good.shemot.maat = u"מט"_s;
+    good.shemot.Bord = u"NB"_s;
     EXPECT_EQ(good.shemot.n1, u"Dana Levi");
     EXPECT_FALSE(CheckDetails(good)) << "a telephone with letters passes";
 
@@ -119,7 +120,7 @@ protected:
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace().ok());
     }
     void put(const QString& name, const QByteArray& bytes) {
-        ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora\\") + name, bytes).ok());
+        ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\"_s + name, bytes).ok());
     }
 
     TestPlatform machine;
@@ -129,8 +130,8 @@ protected:
 
 TEST_F(DetailStoreTest, KeepsNameAndTelephoneInFiveLines) {
     EXPECT_FALSE(*store.details());
-    ASSERT_TRUE(store.SaveDetails({QStringLiteral("דנה \"לוי"), QStringLiteral("03-1")}).ok());
-    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\pratim.txt")),
+    ASSERT_TRUE(store.SaveDetails({u"דנה \"לוי"_s, u"03-1"_s}).ok());
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim.txt"_s),
               "0\r\n\"\xE3\xF0\xE4 \"\xEC\xE5\xE9\"\r\n\"03-1\"\r\n0\r\n0\r\n");
     const auto read = store.details();
     ASSERT_TRUE(read.ok() && *read);
@@ -155,7 +156,7 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
         {"0\n\"Dana\"\n\"03\"\n0\n0\n", true, "Dana", "03"},
     };
     for (const auto& c : cases) {
-        put(QStringLiteral("pratim.txt"), c.stored);
+        put(u"pratim.txt"_s, c.stored);
         const auto read = store.details();
         ASSERT_TRUE(read.ok());
         ASSERT_EQ(read->has_value(), c.found) << c.stored.toStdString();
@@ -167,8 +168,8 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
 }
 
 TEST_F(DetailStoreTest, AnAlbumFieldThatIsMissingMovesTheOthersUp) {
-    ASSERT_TRUE(store.SaveAlbumDetails({QStringLiteral("Studio"), QString(), QStringLiteral("x")}).ok());
-    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\pratim2.txt")), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
+    ASSERT_TRUE(store.SaveAlbumDetails({u"Studio"_s, QString(), u"x"_s}).ok());
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim2.txt"_s), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
     const auto read = store.albumDetails();
     ASSERT_TRUE(read.ok() && *read);
     EXPECT_EQ((*read)->name, u"Studio");

@@ -6,14 +6,16 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class nnnTest : public DetailsPageTest {
 protected:
     // A print order as far as the terms.
     nnn& atTerms(int tile) {
         nnn& page = start();
         page.Image1_Click(tile);
-        page.Text2_Change(QStringLiteral("Dana Levi"));
-        page.Text3_Change(QStringLiteral("03-1234567"));
+        page.Text2_Change(u"Dana Levi"_s);
+        page.Text3_Change(u"03-1234567"_s);
         page.Command12_Click();
         page.Option1_Click(0);
         page.Option3_Click(1);
@@ -40,11 +42,11 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_EQ(state.shemot.ser, u"1234");
     EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
     EXPECT_EQ(state.transfer.HazmanaP + state.transfer.Mefurak, 0);
-    EXPECT_TRUE(machine.files.folderExists(QStringLiteral("C:\\2000lumora\\zmany\\tempred")));
-    EXPECT_FALSE(machine.files.folderExists(QStringLiteral("C:\\vedron"))) << "made before the pictures";
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\tempred"_s));
+    EXPECT_FALSE(machine.files.folderExists(u"C:\\vedron"_s)) << "made before the pictures";
 
-    page.Text2_Change(QStringLiteral(" Dana Levi"));
-    page.Text3_Change(QStringLiteral("03-1234567"));
+    page.Text2_Change(u" Dana Levi"_s);
+    page.Text3_Change(u"03-1234567"_s);
     page.Check2_Click(true);
     page.Command12_Click();
     EXPECT_EQ(page.step, nnn::Step::Options);
@@ -75,8 +77,8 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_EQ(state.shemot.Bord, u"BB1");
     EXPECT_EQ(state.shemot.maat, u"מט");
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_TRUE(machine.files.folderExists(QStringLiteral("C:\\vedron")));
-    EXPECT_TRUE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")));
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\vedron"_s));
+    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_s));
     EXPECT_TRUE(machine.files.fileExists(customerStore));
 }
 
@@ -100,7 +102,7 @@ TEST_F(nnnTest, AsksForBorderAndFitByKindOfOrderAndSwitches) {
         nnn& page = start();
         page.Image1_Click(c.tile);
         EXPECT_EQ(state.ModulRezef, c.tile == 2);
-        page.Text2_Change(QStringLiteral("Dana"));
+        page.Text2_Change(u"Dana"_s);
         page.Command12_Click();
         page.Option1_Click(0);
         page.Option3_Click(1);
@@ -170,13 +172,13 @@ TEST_F(nnnTest, ChecksTheDetailsBeforeTheOptions) {
     page.Command12_Click();
     EXPECT_EQ(machine.dialogs.messages.last(), u"נא להקליד שם ושם שפחה");
     EXPECT_EQ(page.focusBox, u"Text2");
-    page.Text2_Change(QStringLiteral("Dana"));
+    page.Text2_Change(u"Dana"_s);
     const int focused = page.focusRequest;
     page.Command12_Click();
     EXPECT_EQ(machine.dialogs.messages.last(), u"בקשת שנשלח את התמונות עד הבית\nנא להקליד כתובת דואר");
     EXPECT_EQ(page.focusBox, u"Text4");
     EXPECT_GT(page.focusRequest, focused);
-    page.Text4_Change(QStringLiteral("Haifa"));
+    page.Text4_Change(u"Haifa"_s);
     page.Command12_Click();
     EXPECT_EQ(page.step, nnn::Step::Options);
     EXPECT_TRUE(machine.files.fileExists(customerStore));
@@ -189,7 +191,7 @@ TEST_F(nnnTest, TakesTheDetailsFromMemory) {
     EXPECT_EQ(machine.dialogs.messages, QStringList({"לא נמצאו פרטים בזיכרון נא הקלד פרטים"}));
     EXPECT_EQ(page.step, nnn::Step::Details);
     ASSERT_TRUE(machine.files.writeWhole(customerStore, "0\r\n").ok());
-    page.Text2_Change(QStringLiteral("typed"));
+    page.Text2_Change(u"typed"_s);
     page.Command10_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2) << "one line holds no details";
     EXPECT_EQ(page.Text2.text, u"typed");
@@ -201,7 +203,7 @@ TEST_F(nnnTest, TakesTheDetailsFromMemory) {
     page.Command4_Click();
     EXPECT_TRUE(page.Command12.enabled);
     page.Command10_Click();
-    page.Text2_Change(QStringLiteral("Dan"));
+    page.Text2_Change(u"Dan"_s);
     EXPECT_TRUE(page.Command12.enabled);
 }
 
@@ -216,7 +218,7 @@ TEST_F(nnnTest, ForgetsTheDetailsOfACustomerWhoDidNotAskToBeRemembered) {
 }
 
 TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora"), "in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "in the way").ok());
     nnn& page = start();
     page.Image1_Click(0);
     EXPECT_EQ(page.step, nnn::Step::Menu);
@@ -225,7 +227,7 @@ TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
 }
 
 TEST_F(nnnTest, StaysWithAReasonWhenTheCounterFolderCannotBeMade) {
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\vedron"), "in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\vedron"_s, "in the way").ok());
     nnn& page = atTerms(0);
     page.Check1_Click(true);
     page.Command3_Click();
@@ -233,7 +235,7 @@ TEST_F(nnnTest, StaysWithAReasonWhenTheCounterFolderCannotBeMade) {
     EXPECT_EQ(page.step, nnn::Step::Terms);
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"vedron"));
-    ASSERT_TRUE(machine.files.removeFile(QStringLiteral("C:\\vedron")).ok());
+    ASSERT_TRUE(machine.files.removeFile(u"C:\\vedron"_s).ok());
     page.Command3_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
 }
@@ -254,7 +256,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     EXPECT_EQ(page->Combo1.text, u"More Sizes");
     page->Image1_Click(4);
     EXPECT_EQ(state.Optint, 4);
-    EXPECT_TRUE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")));
+    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_s));
     EXPECT_EQ(chain.front()->id(), PageId::MoogMeret);
     EXPECT_EQ(chain.find(PageId::nnn), nullptr);
     chain.unload(PageId::MoogMeret);
@@ -292,8 +294,8 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAsked) {
     nnn& page = start();
     page.Image1_Click(0);
     page.Command2_Click();
-    const QString order = QStringLiteral("C:\\2000lumora\\!!000\\order");
-    ASSERT_TRUE(machine.files.makeFolder(QStringLiteral("C:\\2000lumora\\!!000")).ok());
+    const QString order = u"C:\\2000lumora\\!!000\\order"_s;
+    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\!!000"_s).ok());
     ASSERT_TRUE(machine.files.makeFolder(order).ok());
     for (const char* name : {"!1.jpp", "a.jpp", "order.txt"})
         ASSERT_TRUE(machine.files.writeWhole(order + u'\\' + QString::fromLatin1(name), "x").ok());
@@ -302,7 +304,7 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAsked) {
     page.Command7_Click();
     EXPECT_FALSE(page.Frame1.visible);
     EXPECT_EQ(machine.dialogs.messages, QStringList({"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד"}));
-    EXPECT_EQ(machine.files.names(order, QStringLiteral("*")), QStringList({"!1.jpp", "order.txt"}));
+    EXPECT_EQ(machine.files.names(order, u"*"_s), QStringList({"!1.jpp", "order.txt"}));
 }
 
 TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
@@ -327,15 +329,15 @@ TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
 TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
     nnn& page = start();
     page.Image1_Click(1);
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora\\pratim3.txt"), "0\r\n").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\pratim3.txt"_s, "0\r\n").ok());
     page.QuickCheck();
     EXPECT_EQ(machine.dialogs.messages, QStringList({"אחד או יותר מהפרטים חסרים בדוק שוב בבקשה"}));
-    page.Text2_Change(QStringLiteral(" Dana "));
+    page.Text2_Change(u" Dana "_s);
     page.QuickCheck();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(state.shemot.n1 + state.shemot.n2, u"DanaDana");
     EXPECT_EQ(state.shemot.ppr + state.shemot.maat + state.shemot.Bord + state.shemot.FillFit, u"10/15מבריקNBFIT");
-    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\pratim3.txt")));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\pratim3.txt"_s));
 }
 
 } // namespace

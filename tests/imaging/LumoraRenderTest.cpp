@@ -13,10 +13,12 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class LumoraRenderTest : public testing::Test {
 protected:
     void SetUp() override {
-        ASSERT_TRUE(QDir(m_folder.path()).mkdir(QStringLiteral("out")));
+        ASSERT_TRUE(QDir(m_folder.path()).mkdir(u"out"_s));
         ASSERT_TRUE(
             writeWholeFile(at("a b.jpg").toStdString(), jpegOfKind(testPicture(2000, 1500), {.across = 2, .down = 2})));
         ASSERT_TRUE(writeWholeFile(at("broken.jpg").toStdString(), "broken"));
@@ -41,7 +43,7 @@ protected:
 TEST_F(LumoraRenderTest, plainScalesToThePaperAndTellsTheTimes) {
     EXPECT_EQ(run({"plain", "--paper", "10/15", "--time", "--out", "out", "a b.jpg"}), 0) << qPrintable(m_err);
     EXPECT_EQ(QImage(at("out/a b.jpg")).size(), QSize(1800, 1350));
-    EXPECT_TRUE(m_out.startsWith(QStringLiteral("a b.jpg decode "))) << qPrintable(m_out);
+    EXPECT_TRUE(m_out.startsWith(u"a b.jpg decode "_s)) << qPrintable(m_out);
     EXPECT_EQ(m_out.count(u'\n'), 1);
     EXPECT_EQ(run({"plain", "--paper=10/15", "--png", "--out", "out", "a b.jpg"}), 0);
     EXPECT_EQ(QImage(at("out/a b.png")).size(), QSize(1800, 1350));
@@ -53,7 +55,7 @@ TEST_F(LumoraRenderTest, smallFillsTheCell) {
 }
 
 TEST_F(LumoraRenderTest, previewAndPrintTakeTheRecord) {
-    const QString record = QStringLiteral("1   1   1   27040 225 150 0  0  000");
+    const QString record = u"1   1   1   27040 225 150 0  0  000"_s;
     EXPECT_EQ(
         run({"preview", "--paper", "10/15", "--record", record, "--background", "204060", "--out", "out", "a b.jpg"}),
         0)
@@ -64,12 +66,12 @@ TEST_F(LumoraRenderTest, previewAndPrintTakeTheRecord) {
     EXPECT_NE(preview.pixelColor(225, 150), QColor(0x20, 0x40, 0x60));
     EXPECT_EQ(run({"print", "--paper", "10/15", "--record", record, "--time", "--out", "out", "a b.jpg"}), 0);
     EXPECT_EQ(QImage(at("out/a b.jpg")).size(), QSize(1500, 1000));
-    EXPECT_TRUE(m_out.startsWith(QStringLiteral("a b.jpg decode "))) << qPrintable(m_out);
+    EXPECT_TRUE(m_out.startsWith(u"a b.jpg decode "_s)) << qPrintable(m_out);
 }
 
 TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
     EXPECT_EQ(run({"plain", "--paper", "10/15", "--out", "out", "broken.jpg", "a b.jpg"}), 1);
-    EXPECT_TRUE(m_err.contains(QStringLiteral("broken.jpg"))) << qPrintable(m_err);
+    EXPECT_TRUE(m_err.contains(u"broken.jpg"_s)) << qPrintable(m_err);
     EXPECT_TRUE(QFileInfo::exists(at("out/a b.jpg")));
     EXPECT_FALSE(QFileInfo::exists(at("out/broken.jpg")));
 }
@@ -78,11 +80,10 @@ TEST_F(LumoraRenderTest, aPictureThatFailsIsNamedAndTheOthersAreDone) {
 TEST_F(LumoraRenderTest, aRecordWithAFaultGivesThePictureWithoutThatEdit) {
     const auto record = [](const char* rotation, const char* panX, const char* frame, const char* folder) {
         const auto field = [](const char* text, int width) { return QString::fromLatin1(text).leftJustified(width); };
-        return QStringLiteral("1   1   1   ") + field(rotation, 3) + field("100", 3) + field(panX, 4) +
-               field("150", 4) + field("0", 3) + field("0", 3) + field(frame, 3) + QStringLiteral("000      ") +
-               field(folder, 10);
+        return u"1   1   1   "_s + field(rotation, 3) + field("100", 3) + field(panX, 4) + field("150", 4) +
+               field("0", 3) + field("0", 3) + field(frame, 3) + u"000      "_s + field(folder, 10);
     };
-    ASSERT_TRUE(QDir(m_folder.path()).mkpath(QStringLiteral("frames/aa")));
+    ASSERT_TRUE(QDir(m_folder.path()).mkpath(u"frames/aa"_s));
     QImage black(15, 10, QImage::Format_RGB32);
     black.fill(qRgb(30, 30, 30));
     for (const char* name : {"frames/aa/001.bmp", "frames/aa/k001.bmp", "001.bmp", "k001.bmp"})
@@ -127,7 +128,7 @@ TEST_F(LumoraRenderTest, eachFaultOfACallHasItsStatusAndItsMessage) {
         int status;
         const char* message;
     };
-    const QString record = QStringLiteral("1   1   1   180100225 150 0  0  000");
+    const QString record = u"1   1   1   180100225 150 0  0  000"_s;
     const Case cases[] = {
         {{"print", "--paper", "10/15", "--record", record, "--out", "out", "gone.jpg"}, 1, "gone.jpg"},
         {{"preview", "--paper", "10/15", "--record", record, "--out", "out", "broken.jpg"}, 1, "broken.jpg"},
@@ -140,7 +141,7 @@ TEST_F(LumoraRenderTest, eachFaultOfACallHasItsStatusAndItsMessage) {
     };
     for (const Case& fault : cases) {
         EXPECT_EQ(run(fault.call), fault.status) << qPrintable(fault.call.join(u' '));
-        EXPECT_TRUE(m_err.startsWith(QStringLiteral("lumora-render: "))) << qPrintable(m_err);
+        EXPECT_TRUE(m_err.startsWith(u"lumora-render: "_s)) << qPrintable(m_err);
         EXPECT_TRUE(m_err.contains(QString::fromLatin1(fault.message))) << qPrintable(m_err);
     }
     EXPECT_TRUE(QDir(at("out")).isEmpty());
@@ -159,12 +160,12 @@ TEST_F(LumoraRenderTest, aCallThatCanNotBeUnderstoodDoesNothing) {
           QStringList{"plain", "--paper", "10/15", "--out", ".", "a b.jpg"},
           QStringList{"plain", "--paper", "10/15", "--out", "out", "a b.jpg", "./a b.jpg"}}) {
         EXPECT_EQ(run(call), 2) << qPrintable(call.join(u' '));
-        EXPECT_TRUE(m_err.startsWith(QStringLiteral("lumora-render: "))) << qPrintable(m_err);
+        EXPECT_TRUE(m_err.startsWith(u"lumora-render: "_s)) << qPrintable(m_err);
     }
     EXPECT_EQ(*encodeJpeg(*loadPicture(at("a b.jpg").toStdString()), 90), before);
     EXPECT_TRUE(QDir(at("out")).isEmpty());
     EXPECT_EQ(run({"--help"}), 0);
-    EXPECT_TRUE(m_out.contains(QStringLiteral("--paper")));
+    EXPECT_TRUE(m_out.contains(u"--paper"_s));
 }
 
 } // namespace

@@ -16,6 +16,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 namespace fs = std::filesystem;
 
 class PictureFileTest : public testing::Test {
@@ -173,7 +175,7 @@ TEST_F(PictureFileTest, aFaultyFileIsAFailureThatNamesItAndLeavesNoPrint) {
         EXPECT_FALSE(loadPictureScaled(path, {40, 30}));
         EXPECT_FALSE(scalePictureToJpeg(path, {40, 30}, 90));
     }
-    EXPECT_EQ(leftovers().filter(QStringLiteral(".lumora")), QStringList());
+    EXPECT_EQ(leftovers().filter(u".lumora"_s), QStringList());
 }
 
 TEST_F(PictureFileTest, whatIsNoFileIsRefusedAtOnce) {
@@ -238,7 +240,7 @@ TEST_F(PictureFileTest, aSaveThatFailsKeepsTheOldFile) {
     EXPECT_EQ(nowhere.failure().kind, Failure::Kind::NotFound);
     const auto overFolder = saveJpeg(testPicture(20, 20), in(""), 90);
     EXPECT_FALSE(overFolder);
-    EXPECT_EQ(leftovers(), QStringList{QStringLiteral("old.jpg")});
+    EXPECT_EQ(leftovers(), QStringList{u"old.jpg"_s});
 }
 
 TEST_F(PictureFileTest, theSmallPictureFillsItsCellByTheLongerSide) {

@@ -16,6 +16,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 ReferencePlane lumaOf(const Bitmap& picture) {
     ReferencePlane plane{picture.width(), picture.height(), {}};
     for (int y = 0; y < plane.height; ++y) {
@@ -165,12 +167,12 @@ int inkedRows(const Bitmap& picture) {
 }
 
 TEST(DrawingTest, davidIsDrawnAndAFamilyThatDoesNotExistDrawsNothing) {
-    const QString text = QStringLiteral("שלום Lumora\r\n2024");
+    const QString text = u"שלום Lumora\r\n2024"_s;
     Bitmap known(200, 80, Qt::white);
-    drawText(known, {5, 5}, text, {.family = QStringLiteral("David"), .pixelSize = 24});
+    drawText(known, {5, 5}, text, {.family = u"David"_s, .pixelSize = 24});
     EXPECT_GT(inkedRows(known), 24) << "two lines";
     Bitmap unknown(200, 80, Qt::white);
-    drawText(unknown, {5, 5}, text, {.family = QStringLiteral("No Such Family"), .pixelSize = 24});
+    drawText(unknown, {5, 5}, text, {.family = u"No Such Family"_s, .pixelSize = 24});
     EXPECT_EQ(inkedRows(unknown), 0);
 }
 

@@ -11,6 +11,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 namespace fs = std::filesystem;
 
 class DrivesTest : public ::testing::Test {
@@ -48,15 +50,15 @@ TEST_F(DrivesTest, MapsTheLettersBothWays) {
         EXPECT_EQ(host->lexically_normal(), hostPath) << drivePath;
         EXPECT_EQ(drives.toDrive(hostPath).toStdString(), drivePath);
     }
-    EXPECT_EQ(drives.toHost(QStringLiteral("c:\\a//b\\.\\x\\..\\c")), data / "a" / "b" / "c");
-    EXPECT_EQ(drives.toDrive(data / "sub" / ".." / "x/"), QStringLiteral("C:\\x"));
+    EXPECT_EQ(drives.toHost(u"c:\\a//b\\.\\x\\..\\c"_s), data / "a" / "b" / "c");
+    EXPECT_EQ(drives.toDrive(data / "sub" / ".." / "x/"), u"C:\\x"_s);
 }
 
 TEST_F(DrivesTest, RefusesWhatIsNoPathOfADrive) {
     const Drives drives = make();
     for (const char* path : {"", "C", "***", "\\a", "E:\\a", "1:\\a", "C:\\..\\secret", "C:\\a\\..\\..\\secret"})
         EXPECT_FALSE(drives.toHost(QString::fromLatin1(path))) << path;
-    EXPECT_FALSE(drives.toHost(QStringLiteral("C:\\a") + QChar(0) + u'b'));
+    EXPECT_FALSE(drives.toHost(u"C:\\a"_s + QChar(0) + u'b'));
 }
 
 TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
@@ -64,33 +66,33 @@ TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
     insertCard("TWO");
     fs::create_directories(media / "cdrom"); // a place without a medium
     Drives drives = make(u'E');
-    EXPECT_EQ(drives.programRoot(), QStringLiteral("E:\\"));
-    EXPECT_EQ(drives.toDrive(media / "ONE"), QStringLiteral("D:\\"));
-    EXPECT_EQ(drives.toDrive(media / "TWO"), QStringLiteral("F:\\")); // E: is the program's own
+    EXPECT_EQ(drives.programRoot(), u"E:\\"_s);
+    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_s);
+    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_s); // E: is the program's own
 
     fs::remove_all(media / "ONE");
     drives.refreshMedia();
     EXPECT_EQ(drives.drives().size(), 3U);
-    EXPECT_EQ(drives.toDrive(media / "TWO"), QStringLiteral("F:\\"));
+    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_s);
 
     insertCard("THREE");
     drives.refreshMedia();
-    EXPECT_EQ(drives.toDrive(media / "THREE"), QStringLiteral("G:\\"));
+    EXPECT_EQ(drives.toDrive(media / "THREE"), u"G:\\"_s);
     EXPECT_EQ(drives.drives().size(), 4U);
     insertCard("ONE");
     drives.refreshMedia();
-    EXPECT_EQ(drives.toDrive(media / "ONE"), QStringLiteral("D:\\"));
+    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_s);
 }
 
 TEST_F(DrivesTest, OffersTheDrivesThatTheLabPutsFirstBeforeTheOthers) {
     insertCard("ONE");
     insertCard("TWO");
-    const Drives drives(data, u'C', {media}, QStringLiteral("ZXE"));
+    const Drives drives(data, u'C', {media}, u"ZXE"_s);
     QString letters;
     for (const Drives::Drive& drive : drives.drives())
         letters += drive.letter;
     EXPECT_EQ(letters, u"ZECD");
-    EXPECT_EQ(drives.toDrive(media / "TWO" / "a.jpg"), QStringLiteral("E:\\a.jpg"));
+    EXPECT_EQ(drives.toDrive(media / "TWO" / "a.jpg"), u"E:\\a.jpg"_s);
 }
 
 TEST_F(DrivesTest, CountsAMediumThatShowsTwiceOnce) {
@@ -114,19 +116,19 @@ TEST_F(DrivesTest, CarriesNamesThatAreNoTextAndGivesTheirBytesBack) {
         EXPECT_EQ(drives.toHost(path)->native(), (data / name).native()) << name;
         EXPECT_EQ(path.count(u'\\'), 1) << name;
     }
-    EXPECT_EQ(AnsiCodePage::squeeze(drives.toDrive(data / "a\xff.jpg")), QStringLiteral("C:\\a?.jpg"));
+    EXPECT_EQ(AnsiCodePage::squeeze(drives.toDrive(data / "a\xff.jpg")), u"C:\\a?.jpg"_s);
 }
 
 TEST(ShortenedName, KeepsTheEndingAndTellsLongNamesApart) {
     const QString letters(200, QChar(0x05D0)); // 400 bytes
-    const QString one = ShortenedName(letters + QStringLiteral("1.jpg"));
-    const QString two = ShortenedName(letters + QStringLiteral("2.jpg"));
+    const QString one = ShortenedName(letters + u"1.jpg"_s);
+    const QString two = ShortenedName(letters + u"2.jpg"_s);
     EXPECT_LE(toHostPath(one).native().size(), 255U);
     EXPECT_GE(toHostPath(one).native().size(), 250U);
-    EXPECT_TRUE(one.endsWith(QStringLiteral(".jpg")));
+    EXPECT_TRUE(one.endsWith(u".jpg"_s));
     EXPECT_NE(one, two);
     EXPECT_EQ(ShortenedName(one), one);
-    EXPECT_EQ(ShortenedName(QStringLiteral("קצר.jpg")), QStringLiteral("קצר.jpg"));
+    EXPECT_EQ(ShortenedName(u"קצר.jpg"_s), u"קצר.jpg"_s);
     EXPECT_EQ(ShortenedName(QString(255, u'a')).size(), 255);
     EXPECT_EQ(toHostPath(ShortenedName(QString(130, QChar(0xD83D)) + QString(256, u'.'))).native().size(), 255U);
 }

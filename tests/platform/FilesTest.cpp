@@ -12,6 +12,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 namespace fs = std::filesystem;
 
 class FilesTest : public ::testing::Test {
@@ -52,81 +54,76 @@ TEST_F(FilesTest, ListsByPatternWithoutCaseAndSortsWithoutCase) {
         {"", ""},
     };
     for (const auto& [pattern, expected] : cases)
-        EXPECT_EQ(files.names(QStringLiteral("C:\\"), QString::fromLatin1(pattern)).join(u'|').toStdString(), expected)
-            << pattern;
-    EXPECT_EQ(files.folders(QStringLiteral("C:\\")), QStringList(QStringLiteral("folder.jpg")));
-    EXPECT_TRUE(files.names(QStringLiteral("C:\\missing"), QStringLiteral("*")).isEmpty());
+        EXPECT_EQ(files.names(u"C:\\"_s, QString::fromLatin1(pattern)).join(u'|').toStdString(), expected) << pattern;
+    EXPECT_EQ(files.folders(u"C:\\"_s), QStringList(u"folder.jpg"_s));
+    EXPECT_TRUE(files.names(u"C:\\missing"_s, u"*"_s).isEmpty());
 }
 
 TEST_F(FilesTest, ShowsAQuestionMarkForWhatTheCodePageLacksAndTakesItForAbsent) {
     put("漢.jpg");
     put("\xff.jpg");
-    EXPECT_EQ(files.names(QStringLiteral("C:\\"), QStringLiteral("*.jpg")),
-              QStringList({QStringLiteral("?.jpg"), QStringLiteral("?.jpg")}));
+    EXPECT_EQ(files.names(u"C:\\"_s, u"*.jpg"_s), QStringList({u"?.jpg"_s, u"?.jpg"_s}));
     put("real?.jpg");
-    EXPECT_FALSE(files.fileExists(QStringLiteral("C:\\real?.jpg")));
-    EXPECT_EQ(files.read(QStringLiteral("C:\\real?.jpg")).failure().kind, Failure::Kind::NotFound);
-    EXPECT_FALSE(files.writeWhole(QStringLiteral("C:\\new?.jpg"), "x"));
+    EXPECT_FALSE(files.fileExists(u"C:\\real?.jpg"_s));
+    EXPECT_EQ(files.read(u"C:\\real?.jpg"_s).failure().kind, Failure::Kind::NotFound);
+    EXPECT_FALSE(files.writeWhole(u"C:\\new?.jpg"_s, "x"));
 }
 
 TEST_F(FilesTest, CollectsThroughSubfoldersAndEndsWhereALinkLeadsBack) {
     put("a/1.jpg");
     put("a/b/2.jpg");
     fs::create_directory_symlink(data, data / "a" / "b" / "loop");
-    EXPECT_EQ(files.collect(QStringLiteral("C:\\a\\"), Files::Depth::WithSubfolders).join(u'|'),
-              QStringLiteral("C:\\a\\1.jpg|C:\\a\\b\\2.jpg"));
-    EXPECT_EQ(files.collect(QStringLiteral("C:\\a"), Files::Depth::ThisFolder).join(u'|'),
-              QStringLiteral("C:\\a\\1.jpg"));
+    EXPECT_EQ(files.collect(u"C:\\a\\"_s, Files::Depth::WithSubfolders).join(u'|'), u"C:\\a\\1.jpg|C:\\a\\b\\2.jpg"_s);
+    EXPECT_EQ(files.collect(u"C:\\a"_s, Files::Depth::ThisFolder).join(u'|'), u"C:\\a\\1.jpg"_s);
 }
 
 TEST_F(FilesTest, WritesReadsCopiesAndRemoves) {
     const QByteArray bytes("\r\n\0\xff mixed\n", 11);
-    const QString path = QStringLiteral("C:\\שם.txt");
+    const QString path = u"C:\\שם.txt"_s;
     ASSERT_TRUE(files.writeWhole(path, "old"));
     ASSERT_TRUE(files.writeWhole(path, bytes));
     EXPECT_EQ(files.read(path).value(), bytes);
     EXPECT_EQ(files.size(path).value(), bytes.size());
-    ASSERT_TRUE(files.copyFile(path, QStringLiteral("C:\\copy.txt")));
-    EXPECT_EQ(files.read(QStringLiteral("C:\\copy.txt")).value(), bytes);
+    ASSERT_TRUE(files.copyFile(path, u"C:\\copy.txt"_s));
+    EXPECT_EQ(files.read(u"C:\\copy.txt"_s).value(), bytes);
     ASSERT_TRUE(files.removeFile(path));
     EXPECT_FALSE(files.fileExists(path));
     EXPECT_EQ(countAll(data), 1);
 }
 
 TEST_F(FilesTest, MakesFoldersForTheirOwnerOnly) {
-    ASSERT_TRUE(files.makeFolder(QStringLiteral("C:\\2000lumora")));
-    ASSERT_TRUE(files.makeFolder(QStringLiteral("C:\\2000lumora"))); // again
+    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_s));
+    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_s)); // again
     struct stat status {};
     ASSERT_EQ(::stat((data / "2000lumora").c_str(), &status), 0);
     EXPECT_EQ(status.st_mode & 0777, 0700U);
-    EXPECT_EQ(files.makeFolder(QStringLiteral("C:\\no\\parent")).failure().kind, Failure::Kind::NotFound);
+    EXPECT_EQ(files.makeFolder(u"C:\\no\\parent"_s).failure().kind, Failure::Kind::NotFound);
     put("afile");
-    EXPECT_FALSE(files.makeFolder(QStringLiteral("C:\\afile")));
+    EXPECT_FALSE(files.makeFolder(u"C:\\afile"_s));
 }
 
 TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
-    const QString path = QStringLiteral("C:\\") + QString(200, QChar(0x05D0)) + QStringLiteral(".jpg");
+    const QString path = u"C:\\"_s + QString(200, QChar(0x05D0)) + u".jpg"_s;
     ASSERT_TRUE(files.writeWhole(path, "view"));
     EXPECT_TRUE(files.fileExists(path));
     EXPECT_EQ(files.read(path).value(), "view");
-    const QStringList listed = files.names(QStringLiteral("C:\\"), QStringLiteral("*.jpg"));
+    const QStringList listed = files.names(u"C:\\"_s, u"*.jpg"_s);
     ASSERT_EQ(listed.size(), 1);
-    EXPECT_TRUE(files.removeFile(QStringLiteral("C:\\") + listed[0]));
+    EXPECT_TRUE(files.removeFile(u"C:\\"_s + listed[0]));
 }
 
 TEST_F(FilesTest, FailsWithPathAndReason) {
-    const auto missing = files.read(QStringLiteral("C:\\no.txt"));
+    const auto missing = files.read(u"C:\\no.txt"_s);
     EXPECT_EQ(missing.failure().kind, Failure::Kind::NotFound);
-    EXPECT_TRUE(missing.failure().message.contains(QStringLiteral("C:\\no.txt")))
-        << missing.failure().message.toStdString();
+    EXPECT_TRUE(missing.failure().message.contains(u"C:\\no.txt"_s)) << missing.failure().message.toStdString();
     fs::create_directory(data / "folder");
-    EXPECT_FALSE(files.read(QStringLiteral("C:\\folder")));
-    EXPECT_FALSE(files.writeWhole(QStringLiteral("C:\\folder"), "x"));
-    EXPECT_FALSE(files.removeFile(QStringLiteral("C:\\folder")));
-    EXPECT_FALSE(files.copyFile(QStringLiteral("C:\\no.txt"), QStringLiteral("C:\\to.txt")));
-    EXPECT_FALSE(files.fileExists(QStringLiteral("C:\\to.txt")));
+    EXPECT_FALSE(files.read(u"C:\\folder"_s));
+    EXPECT_FALSE(files.writeWhole(u"C:\\folder"_s, "x"));
+    EXPECT_FALSE(files.removeFile(u"C:\\folder"_s));
+    EXPECT_FALSE(files.copyFile(u"C:\\no.txt"_s, u"C:\\to.txt"_s));
+    EXPECT_FALSE(files.fileExists(u"C:\\to.txt"_s));
     ASSERT_EQ(::mkfifo((data / "pipe").c_str(), 0600), 0);
-    EXPECT_FALSE(files.read(QStringLiteral("C:\\pipe"))); // and does not wait for a writer
+    EXPECT_FALSE(files.read(u"C:\\pipe"_s)); // and does not wait for a writer
     EXPECT_EQ(countAll(data), 2);
 }
 
@@ -136,7 +133,7 @@ TEST(FilesOnASmallDisk, KeepsTheOldFileWhenTheDiskIsFull) {
         GTEST_SKIP() << "mounting takes root";
     const Drives drives(disk.path(), u'C', {});
     const Files files(drives);
-    const QString path = QStringLiteral("C:\\mispar.txt");
+    const QString path = u"C:\\mispar.txt"_s;
     ASSERT_TRUE(files.writeWhole(path, "101\r\n"));
     const auto full = files.writeWhole(path, QByteArray(200'000, 'x'));
     ASSERT_FALSE(full);
@@ -146,23 +143,23 @@ TEST(FilesOnASmallDisk, KeepsTheOldFileWhenTheDiskIsFull) {
 
     ASSERT_TRUE(disk.makeReadOnly());
     EXPECT_EQ(files.writeWhole(path, "102\r\n").failure().kind, Failure::Kind::AccessDenied);
-    EXPECT_EQ(files.makeFolder(QStringLiteral("C:\\new")).failure().kind, Failure::Kind::AccessDenied);
+    EXPECT_EQ(files.makeFolder(u"C:\\new"_s).failure().kind, Failure::Kind::AccessDenied);
     EXPECT_EQ(files.removeFile(path).failure().kind, Failure::Kind::AccessDenied);
     EXPECT_EQ(files.read(path).value(), "101\r\n");
 }
 
 TEST_F(FilesTest, SnapshotsOfAListStayUntilRefreshed) {
     put("a.jpg");
-    FileList list(files, QStringLiteral("*.jpg"));
+    FileList list(files, u"*.jpg"_s);
     EXPECT_EQ(list.count(), 0);
-    list.setFolder(QStringLiteral("C:\\"));
+    list.setFolder(u"C:\\"_s);
     put("b.jpg");
     EXPECT_EQ(list.count(), 1);
     list.refresh();
     EXPECT_EQ(list.count(), 2);
-    EXPECT_EQ(list.name(1), QStringLiteral("b.jpg"));
+    EXPECT_EQ(list.name(1), u"b.jpg"_s);
     EXPECT_EQ(list.name(-1), QString());
-    list.setPattern(QStringLiteral("*.txt"));
+    list.setPattern(u"*.txt"_s);
     EXPECT_EQ(list.count(), 0);
 }
 

@@ -11,6 +11,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(QtEventPump, LetsATimerRunWhileALoopGoesOn) {
     QtEventPump pump;
     bool ran = false;
@@ -41,19 +43,19 @@ TEST(StatVolume, GivesAStableNumberAlsoBeforeTheFolderIsMade) {
     QTemporaryDir folder;
     const Drives drives(toHostPath(folder.path()) / "not" / "yet", u'C', {});
     const StatVolume volume(drives);
-    const auto before = volume.serial(QStringLiteral("C:\\"));
+    const auto before = volume.serial(u"C:\\"_s);
     ASSERT_TRUE(before) << before.failure().message.toStdString();
     std::filesystem::create_directories(drives.dataFolder());
-    EXPECT_EQ(*volume.serial(QStringLiteral("C:\\")), *before);
+    EXPECT_EQ(*volume.serial(u"C:\\"_s), *before);
     EXPECT_NE(*before, 0);
-    EXPECT_FALSE(volume.serial(QStringLiteral("Q:\\")));
+    EXPECT_FALSE(volume.serial(u"Q:\\"_s));
 }
 
 TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
-    EXPECT_EQ(serialOfUuid(QStringLiteral("1234-ABCD")), 0x1234ABCD);
-    EXPECT_EQ(serialOfUuid(QStringLiteral("F000-0001")), static_cast<std::int32_t>(0xF0000001U));
-    EXPECT_NE(serialOfUuid(QStringLiteral("0a1b2c3d-0000-4000-8000-000000000001")),
-              serialOfUuid(QStringLiteral("0a1b2c3d-0000-4000-8000-000000000002")));
+    EXPECT_EQ(serialOfUuid(u"1234-ABCD"_s), 0x1234ABCD);
+    EXPECT_EQ(serialOfUuid(u"F000-0001"_s), static_cast<std::int32_t>(0xF0000001U));
+    EXPECT_NE(serialOfUuid(u"0a1b2c3d-0000-4000-8000-000000000001"_s),
+              serialOfUuid(u"0a1b2c3d-0000-4000-8000-000000000002"_s));
 }
 
 } // namespace

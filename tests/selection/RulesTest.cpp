@@ -10,21 +10,23 @@
 namespace lumora {
 namespace {
 
-const QString path = QStringLiteral("C:\\pics\\תמונה.jpg");
+using namespace Qt::StringLiterals;
+
+const QString path = u"C:\\pics\\תמונה.jpg"_s;
 
 TEST(APrintCode, keepsItsColumnsWhateverItsFieldsHold) {
     struct Case {
         PrintCode code;
         QString text;
     };
-    for (const Case& c : {Case{{12, QStringLiteral("1015"), u'M', QStringLiteral("WB")}, QStringLiteral("121015MWB")},
-                          Case{{1, {}, u' ', QStringLiteral("WBX")}, QStringLiteral("1      WB")},
-                          Case{{3, QStringLiteral("203040"), u'G', {}}, QStringLiteral("3 2030G  ")}})
+    for (const Case& c :
+         {Case{{12, u"1015"_s, u'M', u"WB"_s}, u"121015MWB"_s}, Case{{1, {}, u' ', u"WBX"_s}, u"1      WB"_s},
+          Case{{3, u"203040"_s, u'G', {}}, u"3 2030G  "_s}})
         EXPECT_EQ(c.code.compose(), c.text);
 
-    const PrintCode back = PrintCode::split(QStringLiteral("121015MWBC:\\a.jpg"));
+    const PrintCode back = PrintCode::split(u"121015MWBC:\\a.jpg"_s);
     EXPECT_EQ(back.copies, 12);
-    EXPECT_EQ(back.compose(), QStringLiteral("121015MWB"));
+    EXPECT_EQ(back.compose(), u"121015MWB"_s);
     EXPECT_EQ(PrintCode::copiesOf(QString()), 0);
 }
 
@@ -34,9 +36,8 @@ TEST(APaperLetter, isReadFromTheWordsThatEachPathKnows) {
         char16_t clicked;
         char16_t wholeFolder;
     };
-    for (const Case& c : {Case{QStringLiteral("מט"), u'M', u'M'}, Case{QStringLiteral("מבריק"), u'G', u'G'},
-                          Case{QStringLiteral("M"), u'M', u'M'}, Case{QStringLiteral("Matte"), u'M', u'x'},
-                          Case{QStringLiteral("Glossy"), u'G', u'x'}, Case{QStringLiteral("***"), u'x', u'x'}}) {
+    for (const Case& c : {Case{u"מט"_s, u'M', u'M'}, Case{u"מבריק"_s, u'G', u'G'}, Case{u"M"_s, u'M', u'M'},
+                          Case{u"Matte"_s, u'M', u'x'}, Case{u"Glossy"_s, u'G', u'x'}, Case{u"***"_s, u'x', u'x'}}) {
         EXPECT_EQ(paperLetter(c.word, PaperWords::All, u'x'), c.clicked) << c.word.toStdString();
         EXPECT_EQ(paperLetter(c.word, PaperWords::WholeFolder, u'x'), c.wholeFolder) << c.word.toStdString();
     }
@@ -44,15 +45,15 @@ TEST(APaperLetter, isReadFromTheWordsThatEachPathKnows) {
 
 TEST(ASizeField, hasTheEndsOfThePaperAndIsBlankForASpecialSize) {
     OrderDetails shemot;
-    shemot.ppr = QStringLiteral("09/13");
-    EXPECT_EQ(sizeField(shemot), QStringLiteral("0913"));
-    shemot.ppr = QStringLiteral("zz/zz");
-    EXPECT_EQ(sizeField(shemot), QStringLiteral("    "));
+    shemot.ppr = u"09/13"_s;
+    EXPECT_EQ(sizeField(shemot), u"0913"_s);
+    shemot.ppr = u"zz/zz"_s;
+    EXPECT_EQ(sizeField(shemot), u"    "_s);
 }
 
 TEST(ABasketLine, splitsIntoWhatItWasComposedOfInBothForms) {
-    const BasketLine line{{7, QStringLiteral("1318"), u'G', QStringLiteral("NB")}, EditRecord::newPicture(), path};
-    EXPECT_EQ(line.compose(LineForm::Short), QStringLiteral("7 1318GNB") + path);
+    const BasketLine line{{7, u"1318"_s, u'G', u"NB"_s}, EditRecord::newPicture(), path};
+    EXPECT_EQ(line.compose(LineForm::Short), u"7 1318GNB"_s + path);
     const QString full = line.compose(LineForm::Full);
     EXPECT_EQ(full.size(), 209 + path.size());
     const BasketLine back = BasketLine::split(full, LineForm::Full);
@@ -67,16 +68,15 @@ TEST(AnEditRecord, unpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EXPECT_EQ(fields.GainB, 1.0F);
     EXPECT_EQ(fields.RotationCode, 180);
     EXPECT_EQ(fields.PanY, 999);
-    EXPECT_EQ(fields.AutoMarker, QStringLiteral("000"));
+    EXPECT_EQ(fields.AutoMarker, u"000"_s);
     EXPECT_EQ(fields.TextFontSize, 8);
     EXPECT_EQ(fields.EditState.size(), 200);
     EXPECT_EQ(fields.PicturePath, path);
 
     // One character of its own at the start of each field shows that no column is shifted.
-    const QString record = QStringLiteral("1.290.5 0.02170210-99 12  1  2  034R11RED111") +
-                           LeftField(QStringLiteral("kids"), 10) +
-                           QStringLiteral("242 7 8 1 ddd       255128 1 45 60 9  3 2 ") +
-                           LeftField(QStringLiteral("David"), 30) + LeftField(QStringLiteral("שלום  עולם"), 70);
+    const QString record = u"1.290.5 0.02170210-99 12  1  2  034R11RED111"_s + LeftField(u"kids"_s, 10) +
+                           u"242 7 8 1 ddd       255128 1 45 60 9  3 2 "_s + LeftField(u"David"_s, 30) +
+                           LeftField(u"שלום  עולם"_s, 70);
     UnpackEditState(record, fields);
     EXPECT_FLOAT_EQ(fields.GainR, 1.29F);
     EXPECT_FLOAT_EQ(fields.GainB, 0.02F);
@@ -86,14 +86,14 @@ TEST(AnEditRecord, unpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EXPECT_EQ(fields.PanY, 12);
     EXPECT_EQ(fields.ToneFlag, 1);
     EXPECT_EQ(fields.SpareFlag, 2);
-    EXPECT_EQ(fields.FrameName, QStringLiteral("034"));
-    EXPECT_EQ(fields.LineFrameCode, QStringLiteral("R11"));
-    EXPECT_EQ(fields.RedMarker, QStringLiteral("RED"));
-    EXPECT_EQ(fields.FrameFolder, QStringLiteral("kids"));
+    EXPECT_EQ(fields.FrameName, u"034"_s);
+    EXPECT_EQ(fields.LineFrameCode, u"R11"_s);
+    EXPECT_EQ(fields.RedMarker, u"RED"_s);
+    EXPECT_EQ(fields.FrameFolder, u"kids"_s);
     EXPECT_EQ(fields.TextFontSize, 24);
     EXPECT_EQ(fields.TextAlign, 2);
     EXPECT_EQ(fields.TextOn, 1);
-    EXPECT_EQ(fields.Tag, QStringLiteral("ddd"));
+    EXPECT_EQ(fields.Tag, u"ddd"_s);
     EXPECT_EQ(fields.TextBlue, 255);
     EXPECT_EQ(fields.TextGreen, 128);
     EXPECT_EQ(fields.TextRed, 1);
@@ -101,12 +101,12 @@ TEST(AnEditRecord, unpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EXPECT_EQ(fields.TextY, 60);
     EXPECT_EQ(fields.TextVertical, 3);
     EXPECT_EQ(fields.TextStyle, 2);
-    EXPECT_EQ(fields.TextFont, QStringLiteral("David"));
-    EXPECT_EQ(fields.TextBody, QStringLiteral("שלום  עולם"));
+    EXPECT_EQ(fields.TextFont, u"David"_s);
+    EXPECT_EQ(fields.TextBody, u"שלום  עולם"_s);
 }
 
 QString plainLine(int copies, const QString& of) {
-    return BasketLine{{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}, {}, of}.compose(LineForm::Short);
+    return BasketLine{{copies, u"1015"_s, u'G', u"NB"_s}, {}, of}.compose(LineForm::Short);
 }
 
 TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
@@ -114,20 +114,18 @@ TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
         Basket basket;
         basket.setForm(form);
         const auto add = [&](int copies, const QString& of) {
-            basket.append(
-                BasketLine{{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}, EditRecord::newPicture(), of}
-                    .compose(form));
+            basket.append(BasketLine{{copies, u"1015"_s, u'G', u"NB"_s}, EditRecord::newPicture(), of}.compose(form));
         };
         const auto find = [&](const char* of) { return basket.FindByPath(QString::fromLatin1(of)); };
-        add(1, QStringLiteral("C:\\a.jpg"));
-        add(2, QStringLiteral("C:\\b.jpg"));
-        add(3, QStringLiteral("C:\\a.jpg"));
+        add(1, u"C:\\a.jpg"_s);
+        add(2, u"C:\\b.jpg"_s);
+        add(3, u"C:\\a.jpg"_s);
         EXPECT_EQ(find("C:\\a.jpg"), 0);
         EXPECT_EQ(find("C:\\c.jpg"), -1);
         basket.removeAt(0);
         EXPECT_EQ(find("C:\\a.jpg"), 1);
         EXPECT_EQ(find("C:\\b.jpg"), 0);
-        basket.replaceAt(0, QString(basket.item(1)).replace(QStringLiteral("a.jpg"), QStringLiteral("c.jpg")));
+        basket.replaceAt(0, QString(basket.item(1)).replace(u"a.jpg"_s, u"c.jpg"_s));
         EXPECT_EQ(find("C:\\b.jpg"), -1);
         EXPECT_EQ(find("C:\\c.jpg"), 0);
         EXPECT_EQ(basket.SumCopies(), 6);
@@ -140,19 +138,19 @@ TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
 
 TEST(ABasket, stopsItsSearchAtALineThatIsTooShort) {
     Basket basket;
-    basket.append(plainLine(1, QStringLiteral("C:\\a.jpg")));
-    basket.append(QStringLiteral("1 1015GNBC:"));
-    basket.append(plainLine(1, QStringLiteral("C:\\b.jpg")));
-    EXPECT_EQ(basket.FindByPath9(QStringLiteral("C:\\a.jpg")), 0);
-    EXPECT_EQ(basket.FindByPath9(QStringLiteral("C:\\b.jpg")), -1);
+    basket.append(plainLine(1, u"C:\\a.jpg"_s));
+    basket.append(u"1 1015GNBC:"_s);
+    basket.append(plainLine(1, u"C:\\b.jpg"_s));
+    EXPECT_EQ(basket.FindByPath9(u"C:\\a.jpg"_s), 0);
+    EXPECT_EQ(basket.FindByPath9(u"C:\\b.jpg"_s), -1);
     basket.removeAt(1);
-    EXPECT_EQ(basket.FindByPath9(QStringLiteral("C:\\b.jpg")), 1);
+    EXPECT_EQ(basket.FindByPath9(u"C:\\b.jpg"_s), 1);
 }
 
 TEST(ABasket, holdsTheSumOfCopiesAtWhatAFieldOf16BitsTakes) {
     Basket basket;
     for (int i = 0; i < 400; ++i)
-        basket.append(plainLine(99, QStringLiteral("C:\\%1.jpg").arg(i)));
+        basket.append(plainLine(99, u"C:\\%1.jpg"_s.arg(i)));
     EXPECT_EQ(basket.SumCopies(), 32767);
     while (basket.count() > 2)
         basket.removeAt(0);
@@ -162,68 +160,66 @@ TEST(ABasket, holdsTheSumOfCopiesAtWhatAFieldOf16BitsTakes) {
 TEST(ABasket, dropsLaterLinesThatDifferInTheirCopiesOnly) {
     Basket basket;
     for (const auto& [copies, name] : {std::pair{5, "a"}, {2, "b"}, {9, "a"}, {1, "a"}})
-        basket.append(plainLine(copies, QStringLiteral("C:\\%1.jpg").arg(QLatin1String(name))));
+        basket.append(plainLine(copies, u"C:\\%1.jpg"_s.arg(QLatin1String(name))));
     basket.removeDuplicates();
-    EXPECT_EQ(basket.lines().items(),
-              QStringList({plainLine(5, QStringLiteral("C:\\a.jpg")), plainLine(2, QStringLiteral("C:\\b.jpg"))}));
+    EXPECT_EQ(basket.lines().items(), QStringList({plainLine(5, u"C:\\a.jpg"_s), plainLine(2, u"C:\\b.jpg"_s)}));
     EXPECT_EQ(basket.SumCopies(), 7);
 }
 
 QStringList names(int count) {
     QStringList list;
     for (int i = 1; i <= count; ++i)
-        list += QStringLiteral("%1.jpg").arg(i, 2, 10, QLatin1Char('0'));
+        list += u"%1.jpg"_s.arg(i, 2, 10, QLatin1Char('0'));
     return list;
 }
 
 TEST(AFolderPager, showsThirteenPicturesAsTwelveThenTheLastOneAgainAndAgain) {
     FolderPager pager;
-    EXPECT_EQ(pager.addFolder(QStringLiteral("C:\\p"), names(13)), 13);
+    EXPECT_EQ(pager.addFolder(u"C:\\p"_s, names(13)), 13);
     EXPECT_EQ(pager.FillPageList().size(), 12);
-    EXPECT_EQ(pager.FillPageList(), QStringList(QStringLiteral("C:\\p\\13.jpg")));
-    EXPECT_EQ(pager.FillPageList(), QStringList(QStringLiteral("C:\\p\\13.jpg")));
+    EXPECT_EQ(pager.FillPageList(), QStringList(u"C:\\p\\13.jpg"_s));
+    EXPECT_EQ(pager.FillPageList(), QStringList(u"C:\\p\\13.jpg"_s));
     pager.PageBack();
-    EXPECT_EQ(pager.FillPageList().first(), QStringLiteral("C:\\p\\01.jpg"));
+    EXPECT_EQ(pager.FillPageList().first(), u"C:\\p\\01.jpg"_s);
 }
 
 TEST(AFolderPager, beginsBehindASecondFolderWithTheLastPictureOfTheFirst) {
     FolderPager pager;
-    pager.addFolder(QStringLiteral("C:\\p"), names(3));
+    pager.addFolder(u"C:\\p"_s, names(3));
     pager.FillPageList();
-    pager.addFolder(QStringLiteral("C:\\q"), names(5));
+    pager.addFolder(u"C:\\q"_s, names(5));
     const QStringList page = pager.FillPageList();
-    EXPECT_EQ(page.first(), QStringLiteral("C:\\p\\03.jpg"));
+    EXPECT_EQ(page.first(), u"C:\\p\\03.jpg"_s);
     EXPECT_EQ(page.size(), 6);
 }
 
 TEST(AFolderPager, doublesAnOrdinaryFolderButNoDriveRoot) {
     FolderPager pager;
     for (int i = 0; i < 2; ++i)
-        pager.addFolder(QStringLiteral("C:\\p"), names(4));
+        pager.addFolder(u"C:\\p"_s, names(4));
     EXPECT_EQ(pager.count(), 8);
-    EXPECT_EQ(pager.addFolder(QStringLiteral("E:\\"), names(4)), 4);
-    EXPECT_EQ(pager.item(8), QStringLiteral("E:\\01.jpg"));
+    EXPECT_EQ(pager.addFolder(u"E:\\"_s, names(4)), 4);
+    EXPECT_EQ(pager.item(8), u"E:\\01.jpg"_s);
     pager.FillPageList();
     const int position = pager.currentIndex();
-    EXPECT_EQ(pager.addFolder(QStringLiteral("E:\\"), names(4)), 0);
+    EXPECT_EQ(pager.addFolder(u"E:\\"_s, names(4)), 0);
     EXPECT_EQ(pager.currentIndex(), position);
 }
 
 TEST(AFolderPager, takesNoPictureOfAFolderForOneBesideIt) {
     FolderPager pager;
-    pager.addFolder(QStringLiteral("C:\\p"), {QStringLiteral("a01.jpg")});
-    EXPECT_EQ(pager.addFolder(QStringLiteral("C:\\p\\a"), names(2)), 2);
+    pager.addFolder(u"C:\\p"_s, {u"a01.jpg"_s});
+    EXPECT_EQ(pager.addFolder(u"C:\\p\\a"_s, names(2)), 2);
 }
 
 TEST(AFolderPager, goesBackByThePageInViewAndTheOneBefore) {
     for (const auto& [pages, firstAfterBack] : {std::pair{1, 1}, {2, 1}, {3, 13}, {4, 25}}) {
         FolderPager pager;
-        pager.addFolder(QStringLiteral("C:\\p"), names(60));
+        pager.addFolder(u"C:\\p"_s, names(60));
         for (int i = 0; i < pages; ++i)
             pager.FillPageList();
         pager.PageBack();
-        EXPECT_EQ(pager.FillPageList().first(),
-                  QStringLiteral("C:\\p\\%1.jpg").arg(firstAfterBack, 2, 10, QLatin1Char('0')));
+        EXPECT_EQ(pager.FillPageList().first(), u"C:\\p\\%1.jpg"_s.arg(firstAfterBack, 2, 10, QLatin1Char('0')));
     }
 }
 
@@ -233,12 +229,12 @@ TEST(APrintGrade, goesByThePixelCountAlone) {
         PrintGrade grade;
         QString text;
     };
-    for (const Case& c : {Case{{1600, 1200}, PrintGrade::Good, QStringLiteral("  איכות  1200 / 1600")},
-                          Case{{1000, 800}, PrintGrade::Unmarked, {}},
-                          Case{{799999, 1}, PrintGrade::Borderline, QStringLiteral("  איכות גבולית  1 / 799999")},
-                          Case{{500, 800}, PrintGrade::Borderline, QStringLiteral("  איכות גבולית  800 / 500")},
-                          Case{{1, 399999}, PrintGrade::VeryLow, QStringLiteral("  איכות נמוכה מאוד  399999 / 1")},
-                          Case{{65500, 65500}, PrintGrade::Good, QStringLiteral("  איכות  65500 / 65500")}}) {
+    for (const Case& c :
+         {Case{{1600, 1200}, PrintGrade::Good, u"  איכות  1200 / 1600"_s}, Case{{1000, 800}, PrintGrade::Unmarked, {}},
+          Case{{799999, 1}, PrintGrade::Borderline, u"  איכות גבולית  1 / 799999"_s},
+          Case{{500, 800}, PrintGrade::Borderline, u"  איכות גבולית  800 / 500"_s},
+          Case{{1, 399999}, PrintGrade::VeryLow, u"  איכות נמוכה מאוד  399999 / 1"_s},
+          Case{{65500, 65500}, PrintGrade::Good, u"  איכות  65500 / 65500"_s}}) {
         EXPECT_EQ(printGrade(c.size), c.grade);
         EXPECT_EQ(printGradeText(c.grade, c.size, false), c.text);
     }

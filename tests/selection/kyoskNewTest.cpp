@@ -16,6 +16,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // A page that is only shown.
 class NextPage : public Page {
 public:
@@ -25,10 +27,10 @@ public:
 class ThePictures : public testing::Test {
 protected:
     ThePictures() {
-        state.DiskRoot = QStringLiteral("C:\\");
-        state.shemot.ppr = QStringLiteral("10/15");
-        state.shemot.maat = QStringLiteral("מבריק");
-        state.shemot.Bord = QStringLiteral("NB");
+        state.DiskRoot = u"C:\\"_s;
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.maat = u"מבריק"_s;
+        state.shemot.Bord = u"NB"_s;
         state.Optint = 1;
         chain.registerPage(PageId::kyoskNew,
                            [this] { return std::make_unique<kyoskNew>(state, machine.platform, chain); });
@@ -54,7 +56,7 @@ protected:
             ASSERT_TRUE(machine.files.makeFolder(folder));
         }
         for (int i = 1; i <= count; ++i) {
-            const QString name = QStringLiteral("%1.jpg").arg(i, 2, 10, QLatin1Char('0'));
+            const QString name = u"%1.jpg"_s.arg(i, 2, 10, QLatin1Char('0'));
             const auto host = machine.drives.toHost(JoinDrivePath(folder, name));
             ASSERT_TRUE(host && saveJpeg(Bitmap(size.width, size.height, Qt::red), *host, 80));
         }
@@ -72,9 +74,9 @@ protected:
 
     // The page with a folder of so many pictures.
     kyoskNew& openWith(int count) {
-        makePictures(QStringLiteral("C:\\p"), count);
+        makePictures(u"C:\\p"_s, count);
         kyoskNew& page = open();
-        pick(page, QStringLiteral("C:\\p\\01.jpg"));
+        pick(page, u"C:\\p\\01.jpg"_s);
         return page;
     }
 
@@ -90,12 +92,12 @@ protected:
     PageChain chain{machine.pump};
 };
 
-const QString first = QStringLiteral("C:\\p\\01.jpg");
+const QString first = u"C:\\p\\01.jpg"_s;
 
 TEST_F(ThePictures, areShownTwelveAtATimeAndTheLastOneAgain) {
     kyoskNew& page = openWith(13);
-    EXPECT_EQ(page.Label34.text, QStringLiteral("13"));
-    EXPECT_EQ(page.Label29.text, QStringLiteral("C:\\p"));
+    EXPECT_EQ(page.Label34.text, u"13"_s);
+    EXPECT_EQ(page.Label29.text, u"C:\\p"_s);
     for (const int shown : {12, 1, 1}) {
         EXPECT_EQ(page.List2.count(), shown);
         EXPECT_EQ(shownCells(page), shown);
@@ -114,29 +116,29 @@ TEST_F(ThePictures, stayAsTheyAreWhenTheDialogIsCancelled) {
     EXPECT_EQ(page.List4.currentIndex(), 12);
     EXPECT_EQ(page.List2.item(0), first);
     EXPECT_EQ(shownCells(page), 12);
-    EXPECT_EQ(machine.dialogs.pickRequests.last(), QStringLiteral("בחר תמונה אחת בלבד |C:\\|Open"));
+    EXPECT_EQ(machine.dialogs.pickRequests.last(), u"בחר תמונה אחת בלבד |C:\\|Open"_s);
 }
 
 TEST_F(ThePictures, ofADriveRootCarryOneBackslashAndStandOnce) {
-    makePictures(QStringLiteral("C:\\"), 2);
+    makePictures(u"C:\\"_s, 2);
     kyoskNew& page = open();
     for (int i = 0; i < 2; ++i)
-        pick(page, QStringLiteral("C:\\02.jpg"));
-    EXPECT_EQ(page.List4.paths().items(), QStringList({QStringLiteral("C:\\01.jpg"), QStringLiteral("C:\\02.jpg")}));
+        pick(page, u"C:\\02.jpg"_s);
+    EXPECT_EQ(page.List4.paths().items(), QStringList({u"C:\\01.jpg"_s, u"C:\\02.jpg"_s}));
 }
 
 TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesOnly) {
     kyoskNew& page = openWith(2);
-    pick(page, QStringLiteral("C:\\?\\01.jpg"));
+    pick(page, u"C:\\?\\01.jpg"_s);
     EXPECT_EQ(machine.dialogs.messages,
-              QStringList(QStringLiteral("File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English")));
+              QStringList(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s));
     EXPECT_EQ(page.List4.count(), 2);
     EXPECT_TRUE(page.Picture1[0].visible);
 }
 
 TEST_F(ThePictures, leaveACellEmptyForAFileThatCannotBeRead) {
-    makePictures(QStringLiteral("C:\\p"), 3);
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\p\\02.jpg"), "no picture"));
+    makePictures(u"C:\\p"_s, 3);
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\02.jpg"_s, "no picture"));
     kyoskNew& page = open();
     pick(page, first);
     EXPECT_EQ(shownCells(page), 2);
@@ -157,7 +159,7 @@ TEST_F(ThePictures, areDrawnByTheLatestClickWhenClicksArriveMeanwhile) {
             page.Image16_Click();
     };
     page.Image16_Click();
-    EXPECT_EQ(page.List2.item(0), QStringLiteral("C:\\p\\25.jpg"));
+    EXPECT_EQ(page.List2.item(0), u"C:\\p\\25.jpg"_s);
     EXPECT_EQ(page.List2.count(), 6);
     EXPECT_EQ(shownCells(page), 6);
     EXPECT_EQ(pumps, 2);
@@ -168,35 +170,34 @@ TEST_F(ThePictures, areChosenCountedAndCancelledInTheirCells) {
     page.Picture1_Click(2);
     page.Picture1_Click(0);
     page.Picture1_Click(5);
-    EXPECT_EQ(page.List1.lines().items(),
-              QStringList({QStringLiteral("1 1015GNBC:\\p\\03.jpg"), QStringLiteral("1 1015GNBC:\\p\\01.jpg")}));
+    EXPECT_EQ(page.List1.lines().items(), QStringList({u"1 1015GNBC:\\p\\03.jpg"_s, u"1 1015GNBC:\\p\\01.jpg"_s}));
     EXPECT_TRUE(page.Picture4[0].visible);
     EXPECT_FALSE(page.Picture4[1].visible);
 
     for (int i = 0; i < 11; ++i)
         page.Command12_Click(2);
-    state.shemot.ppr = QStringLiteral("13/18");
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("121015GNBC:\\p\\03.jpg"));
-    EXPECT_EQ(page.Label7.text, QStringLiteral("13"));
+    state.shemot.ppr = u"13/18"_s;
+    EXPECT_EQ(page.List1.item(0), u"121015GNBC:\\p\\03.jpg"_s);
+    EXPECT_EQ(page.Label7.text, u"13"_s);
     page.Picture1_Click(2); // takes the paper of now, keeps the copies and the place
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("121318GNBC:\\p\\03.jpg"));
+    EXPECT_EQ(page.List1.item(0), u"121318GNBC:\\p\\03.jpg"_s);
 
     for (int i = 0; i < 100; ++i)
         page.Command12_Click(2);
-    EXPECT_EQ(page.Label4[2].text, QStringLiteral("99"));
+    EXPECT_EQ(page.Label4[2].text, u"99"_s);
     page.Command13_Click(0);
     EXPECT_EQ(page.List1.count(), 1);
     EXPECT_FALSE(page.Picture4[0].visible);
-    EXPECT_EQ(page.Label7.text, QStringLiteral("99"));
+    EXPECT_EQ(page.Label7.text, u"99"_s);
     page.Command13_Click(0);
     page.Command13_Click(7);
     EXPECT_EQ(page.List1.count(), 1);
     page.Picture1_Click(0);
-    EXPECT_EQ(page.Label4[0].text, QStringLiteral("1"));
+    EXPECT_EQ(page.Label4[0].text, u"1"_s);
 
     page.Image8_Click();
     EXPECT_TRUE(page.List1.isEmpty());
-    EXPECT_EQ(page.Label7.text, QStringLiteral("0"));
+    EXPECT_EQ(page.Label7.text, u"0"_s);
 }
 
 TEST_F(ThePictures, showTheirMarksAgainWhenThePageComesBackAndAlone) {
@@ -208,19 +209,19 @@ TEST_F(ThePictures, showTheirMarksAgainWhenThePageComesBackAndAlone) {
     page.Picture1_Click(0);
     page.Image15_Click();
     EXPECT_TRUE(page.Picture4[1].visible);
-    EXPECT_EQ(page.Label4[1].text, QStringLiteral("2"));
+    EXPECT_EQ(page.Label4[1].text, u"2"_s);
 
     page.Command14_Click();
-    EXPECT_EQ(page.List2.items(), QStringList({QStringLiteral("C:\\p\\02.jpg"), QStringLiteral("C:\\p\\13.jpg")}));
+    EXPECT_EQ(page.List2.items(), QStringList({u"C:\\p\\02.jpg"_s, u"C:\\p\\13.jpg"_s}));
     EXPECT_TRUE(page.Picture4[0].visible);
-    EXPECT_EQ(page.Label4[0].text, QStringLiteral("2"));
+    EXPECT_EQ(page.Label4[0].text, u"2"_s);
 }
 
 TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
-    makePictures(QStringLiteral("C:\\q"), 1, {1000, 800});
+    makePictures(u"C:\\q"_s, 1, {1000, 800});
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
-    EXPECT_EQ(page.Label6.text, QStringLiteral("  איכות נמוכה מאוד  30 / 40"));
+    EXPECT_EQ(page.Label6.text, u"  איכות נמוכה מאוד  30 / 40"_s);
     EXPECT_TRUE(page.Picture2.warning);
     EXPECT_EQ(page.Picture2.bitmap.width(), 400);
     for (const int width : {300, 400, 300, 400}) {
@@ -229,10 +230,10 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
         EXPECT_EQ(page.Picture2.bitmap.height(), 700 - width);
     }
     // At exactly 800000 pixels the text of the picture before stays, and no warning is painted.
-    pick(page, QStringLiteral("C:\\q\\01.jpg"));
+    pick(page, u"C:\\q\\01.jpg"_s);
     page.Picture1_Click(1);
-    EXPECT_EQ(page.Label1.text, QStringLiteral("C:\\q\\01.jpg"));
-    EXPECT_EQ(page.Label6.text, QStringLiteral("  איכות נמוכה מאוד  30 / 40"));
+    EXPECT_EQ(page.Label1.text, u"C:\\q\\01.jpg"_s);
+    EXPECT_EQ(page.Label6.text, u"  איכות נמוכה מאוד  30 / 40"_s);
     EXPECT_FALSE(page.Picture2.warning);
 }
 
@@ -244,14 +245,14 @@ TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
     page.Command12_Click(0);
     page.Command26_Click(0);
     EXPECT_EQ(page.List1.count(), 14);
-    EXPECT_EQ(page.Label7.text, QStringLiteral("14"));
+    EXPECT_EQ(page.Label7.text, u"14"_s);
     EXPECT_EQ(page.List2.item(0), first);
     EXPECT_TRUE(page.Picture4[11].visible);
 
     page.Command23_Click();
     EXPECT_TRUE(page.List1.isEmpty());
     EXPECT_TRUE(page.List4.isEmpty());
-    EXPECT_EQ(page.Label7.text, QStringLiteral("0"));
+    EXPECT_EQ(page.Label7.text, u"0"_s);
     EXPECT_FALSE(page.Frame1.visible);
     EXPECT_EQ(shownCells(page), 0);
     pick(page, first);
@@ -261,56 +262,56 @@ TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
 
 TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
     state.Optint = 10;
-    state.shemot.ppr = QStringLiteral("30/60");
-    state.shemot.maat = QStringLiteral("M");
-    state.album.MailZalam = QStringLiteral("studio@example.com");
+    state.shemot.ppr = u"30/60"_s;
+    state.shemot.maat = u"M"_s;
+    state.album.MailZalam = u"studio@example.com"_s;
     kyoskNew& page = openWith(3);
     ASSERT_TRUE(page.Picture66.visible);
     EXPECT_TRUE(page.Image13.visible);
     EXPECT_FALSE(page.Image7.visible);
     page.Image13_Click();
-    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא נבחרו תמונות")));
-    EXPECT_EQ(page.Txt4Ml2.text, QStringLiteral("studio@example.com"));
+    EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
+    EXPECT_EQ(page.Txt4Ml2.text, u"studio@example.com"_s);
     page.Command24_Click();
     EXPECT_FALSE(page.Image13.visible);
     EXPECT_TRUE(page.Image7.visible) << "there is always a way to finish";
     page.Image7_Click();
-    page.Txt4Ml2_Change(QStringLiteral("other@example.com"));
+    page.Txt4Ml2_Change(u"other@example.com"_s);
     page.Command8_Click();
     EXPECT_EQ(chain.front()->id(), PageId::Form2);
-    EXPECT_EQ(state.shemot.Mail, QStringLiteral("other@example.com"));
+    EXPECT_EQ(state.shemot.Mail, u"other@example.com"_s);
     EXPECT_EQ(state.DchisaAmoka, 1);
     EXPECT_TRUE(state.handOver.pressStart);
-    EXPECT_EQ(state.handOver.lines.value(0), QStringLiteral("1 3060MNB") + first);
+    EXPECT_EQ(state.handOver.lines.value(0), u"1 3060MNB"_s + first);
 }
 
 TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
     state.Optint = 2;
     kyoskNew& page = openWith(3);
     page.Picture1_Click(0);
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("1 1015GNB") + EditRecord::newPicture() + first);
+    EXPECT_EQ(page.List1.item(0), u"1 1015GNB"_s + EditRecord::newPicture() + first);
 
     QString record = EditRecord::newPicture();
-    record.replace(15, 3, QStringLiteral("130")).replace(38, 3, QStringLiteral("RED"));
+    record.replace(15, 3, u"130"_s).replace(38, 3, u"RED"_s);
     state.edit.EditState = record;
     page.Command12_Click(0);
-    page.Label4[0].text = QStringLiteral("55"); // shows another picture by now
+    page.Label4[0].text = u"55"_s; // shows another picture by now
     page.ZZvvA_Click();
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("2 1015GNB") + record + first);
-    const Result<QByteArray> all = machine.files.read(QStringLiteral("C:\\2000lumora\\Tik4txt\\all_list.txt"));
-    const Result<QByteArray> one = machine.files.read(QStringLiteral("C:\\2000lumora\\Tik4txt\\00onepic.txt"));
+    EXPECT_EQ(page.List1.item(0), u"2 1015GNB"_s + record + first);
+    const Result<QByteArray> all = machine.files.read(u"C:\\2000lumora\\Tik4txt\\all_list.txt"_s);
+    const Result<QByteArray> one = machine.files.read(u"C:\\2000lumora\\Tik4txt\\00onepic.txt"_s);
     ASSERT_TRUE(all && one);
-    EXPECT_EQ(*all, (page.List1.item(0) + QStringLiteral("\r\n")).toLatin1());
+    EXPECT_EQ(*all, (page.List1.item(0) + u"\r\n"_s).toLatin1());
     EXPECT_EQ(*one, *all);
 
-    page.Label4[0].text = QStringLiteral("2");
+    page.Label4[0].text = u"2"_s;
     page.Picture1_Click(1);
     EXPECT_EQ(state.edit.ZoomPercent, 100);
-    state.shemot.maat = QStringLiteral("Matte");
+    state.shemot.maat = u"Matte"_s;
     page.Picture1_Click(0);
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("2 1015MNB") + record + first);
+    EXPECT_EQ(page.List1.item(0), u"2 1015MNB"_s + record + first);
     EXPECT_EQ(state.edit.ZoomPercent, 130);
-    EXPECT_EQ(state.edit.TempRedName, QStringLiteral("C;]p]01.jpg"));
+    EXPECT_EQ(state.edit.TempRedName, u"C;]p]01.jpg"_s);
     page.Command14_Click();
     EXPECT_EQ(page.List2.item(0), first);
 }
@@ -323,7 +324,7 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
     EXPECT_EQ(chain.front(), &editor());
     EXPECT_EQ(page.Command13[0].colour, kyoskNew::KeyColour::Orange);
     EXPECT_TRUE(page.editorView.visible);
-    EXPECT_EQ(page.List1.item(0).mid(9 + 12, 14), QStringLiteral("180100225 150 "));
+    EXPECT_EQ(page.List1.item(0).mid(9 + 12, 14), u"180100225 150 "_s);
     editor().Image4_Click(); // grey
     editor().CommandDone_Click();
     EXPECT_EQ(chain.front(), &page);
@@ -360,7 +361,7 @@ TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
     editor().Image2_MouseDown(0);
     editor().Timer2_Tick();
     page.Picture1_Click(1);
-    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("102"));
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"102"_s);
     EXPECT_EQ(state.edit.ZoomPercent, 100);
 
     // Another picture that comes while the release of the zoom lets events through.
@@ -372,21 +373,21 @@ TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
         page.Picture1_Click(1);
     };
     editor().Image2_MouseUp(0);
-    EXPECT_EQ(field(EditRecord::ZoomPercent), QStringLiteral("104"));
-    EXPECT_EQ(page.List1.item(1).mid(9 + 15, 3), QStringLiteral("100"));
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"104"_s);
+    EXPECT_EQ(page.List1.item(1).mid(9 + 15, 3), u"100"_s);
 
     // A caption that was dragged, which does not pack by itself.
     page.Picture1_Click(0);
     state.edit.TextOn = 1;
-    state.edit.TextBody = QStringLiteral("abc");
+    state.edit.TextBody = u"abc"_s;
     editor().Command11_Click();
     editor().Labeltext_MouseDown({0, 0});
     editor().Labeltext_MouseMove({130, 260});
     editor().Labeltext_MouseUp();
-    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("0  "));
+    EXPECT_EQ(field(EditRecord::TextX), u"0  "_s);
     editor().CommandDone_Click();
-    EXPECT_EQ(field(EditRecord::TextX), QStringLiteral("10 "));
-    EXPECT_EQ(field(EditRecord::TextY), QStringLiteral("20 "));
+    EXPECT_EQ(field(EditRecord::TextX), u"10 "_s);
+    EXPECT_EQ(field(EditRecord::TextY), u"20 "_s);
 }
 
 TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
@@ -397,7 +398,7 @@ TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
     page.Picture1_Click(0);
     EXPECT_EQ(chain.front(), &page);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_EQ(page.List1.item(0), QStringLiteral("1 1015GNB") + EditRecord::newPicture() + first);
+    EXPECT_EQ(page.List1.item(0), u"1 1015GNB"_s + EditRecord::newPicture() + first);
     page.Picture1_Click(1);
     EXPECT_EQ(chain.front(), &editor());
     EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
@@ -415,7 +416,7 @@ TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     page.Image7_Click();
     page.Command7_Click();
     ASSERT_EQ(chain.front()->id(), PageId::B3);
-    EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 6), QStringLiteral("270102"));
+    EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 6), u"270102"_s);
     EXPECT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
     EXPECT_EQ(chain.find(PageId::tFrmNew), nullptr);
     EXPECT_EQ(chain.find(PageId::BigPics), nullptr);
@@ -432,12 +433,12 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     page.Image7_Click();
     EXPECT_TRUE(page.Frame4.visible);
     EXPECT_FALSE(page.Pic4snifim.visible);
-    EXPECT_EQ(page.Combo1.text, QStringLiteral("בחר או הקלד"));
-    EXPECT_EQ(page.Label19.text, QStringLiteral("10/15"));
-    EXPECT_EQ(page.Label20.text, QStringLiteral("3"));
-    page.Text1_Change(QStringLiteral("dana"));
-    page.Combo1_Change(QStringLiteral("example.com"));
-    page.Text2_Change(QStringLiteral("gift"));
+    EXPECT_EQ(page.Combo1.text, u"בחר או הקלד"_s);
+    EXPECT_EQ(page.Label19.text, u"10/15"_s);
+    EXPECT_EQ(page.Label20.text, u"3"_s);
+    page.Text1_Change(u"dana"_s);
+    page.Combo1_Change(u"example.com"_s);
+    page.Text2_Change(u"gift"_s);
     int handOvers = 0;
     QObject::connect(&chain, &PageChain::shown, [&](Page* shown) { handOvers += shown->id() == PageId::Form2; });
     machine.pump.onPump = [&] { page.Command8_Click(); }; // an impatient second press
@@ -445,17 +446,16 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     EXPECT_EQ(handOvers, 1);
     EXPECT_EQ(chain.front()->id(), PageId::Form2);
     EXPECT_EQ(chain.find(PageId::kyoskNew), nullptr);
-    EXPECT_EQ(state.handOver.lines,
-              QStringList({QStringLiteral("1 1015GNBC:\\p\\01.jpg"), QStringLiteral("2 1015GNBC:\\p\\02.jpg")}));
+    EXPECT_EQ(state.handOver.lines, QStringList({u"1 1015GNBC:\\p\\01.jpg"_s, u"2 1015GNBC:\\p\\02.jpg"_s}));
     EXPECT_TRUE(state.handOver.pressStart);
-    EXPECT_EQ(state.shemot.Mail, QStringLiteral("dana@example.com"));
-    EXPECT_EQ(state.shemot.Hearot, QStringLiteral("gift - "));
+    EXPECT_EQ(state.shemot.Mail, u"dana@example.com"_s);
+    EXPECT_EQ(state.shemot.Hearot, u"gift - "_s);
 }
 
 TEST_F(ThePictures, goOnWithoutAnAddressOrBackToTheChoice) {
     kyoskNew& page = openWith(1);
     page.Image7_Click();
-    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא נבחרו תמונות")));
+    EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
     EXPECT_FALSE(page.Frame4.visible);
     page.Picture1_Click(0);
     page.Image7_Click();
@@ -464,8 +464,8 @@ TEST_F(ThePictures, goOnWithoutAnAddressOrBackToTheChoice) {
     EXPECT_EQ(page.List1.count(), 1);
     page.Image7_Click();
     page.Command7_Click();
-    EXPECT_EQ(state.shemot.Mail, QStringLiteral("לא הוקלד"));
-    EXPECT_EQ(state.shemot.Hearot, QStringLiteral(" - "));
+    EXPECT_EQ(state.shemot.Mail, u"לא הוקלד"_s);
+    EXPECT_EQ(state.shemot.Hearot, u" - "_s);
     EXPECT_EQ(chain.front()->id(), PageId::Form2);
 }
 
@@ -475,14 +475,14 @@ TEST_F(ThePictures, ofAnEditedOrderStayInTheBasketWhileNothingCanPrepareThem) {
     page.Picture1_Click(0);
     page.Image7_Click();
     page.Command8_Click();
-    EXPECT_EQ(machine.dialogs.messages, QStringList(QStringLiteral("לא הקלדת כתובת דואר")));
-    EXPECT_EQ(page.focusBox, QStringLiteral("Text1"));
-    state.shemot.Mail = QStringLiteral("before");
+    EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא הקלדת כתובת דואר"_s));
+    EXPECT_EQ(page.focusBox, u"Text1"_s);
+    state.shemot.Mail = u"before"_s;
     page.Command7_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_EQ(chain.front(), &page);
     EXPECT_EQ(page.List1.count(), 1);
-    EXPECT_EQ(state.shemot.Mail, QStringLiteral("before"));
+    EXPECT_EQ(state.shemot.Mail, u"before"_s);
 
     registerNext(PageId::B3);
     page.Command7_Click();
@@ -494,8 +494,7 @@ TEST_F(ThePictures, ofAnEditedOrderStayInTheBasketWhileNothingCanPrepareThem) {
 TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     state.coupon.HaKoopon = 1;
     state.coupon.MisparKoopon = 2;
-    state.profile.Branches[3] = {
-        QStringLiteral("חיפה"), QStringLiteral("סניף חיפה"), {QStringLiteral("הנביאים 1"), {}}, QStringLiteral("04-1")};
+    state.profile.Branches[3] = {u"חיפה"_s, u"סניף חיפה"_s, {u"הנביאים 1"_s, {}}, u"04-1"_s};
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
     page.Image7_Click();
@@ -504,17 +503,16 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     page.Command12_Click(0);
     page.Image7_Click();
     EXPECT_FALSE(page.Frame4.visible);
-    EXPECT_EQ(
-        machine.dialogs.messages,
-        QStringList({QStringLiteral("עליך לבחור תמונות לא פחות מהכמות שרכשת בקופון\nלא תתקבלנה הזמנות שאינן במלואן"),
-                     QStringLiteral("חרגת מכמות התמונות שרכשת בקופון\nעליך לבטל בחירה של חלק מהתמונות")}));
+    EXPECT_EQ(machine.dialogs.messages,
+              QStringList({u"עליך לבחור תמונות לא פחות מהכמות שרכשת בקופון\nלא תתקבלנה הזמנות שאינן במלואן"_s,
+                           u"חרגת מכמות התמונות שרכשת בקופון\nעליך לבטל בחירה של חלק מהתמונות"_s}));
     EXPECT_EQ(page.List1.SumCopies(), 3) << "a refusal leaves the basket whole";
     page.Command13_Click(0);
     page.Image7_Click();
     EXPECT_TRUE(page.Frame4.visible);
     EXPECT_TRUE(page.Pic4snifim.visible);
     page.Command4Snif_MouseMove(3);
-    EXPECT_EQ(page.Label41.text, QStringLiteral("סניף חיפה\nהנביאים 1\n04-1"));
+    EXPECT_EQ(page.Label41.text, u"סניף חיפה\nהנביאים 1\n04-1"_s);
     page.Command4Snif_MouseMove(11);
     EXPECT_EQ(page.Label41.text, QString());
     page.Command4Snif_MouseMove(10);
@@ -524,11 +522,11 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     page.Image7_Click();
     page.Command28_Click();
     page.Command8_Click();
-    EXPECT_EQ(state.shemot.Hearot, QStringLiteral(" - חיפה"));
+    EXPECT_EQ(state.shemot.Hearot, u" - חיפה"_s);
 }
 
 TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
-    state.shemot.ppr = QStringLiteral("30/45");
+    state.shemot.ppr = u"30/45"_s;
     for (const auto& [mode, policy, asked, on] :
          {std::tuple{1, 2, false, 1}, {1, 1, true, 0}, {2, 1, false, 0}, {10, 2, false, 1}}) {
         static_cast<void>(machine.files.removeFile(first));
@@ -553,8 +551,8 @@ TEST_F(ThePictures, closeWithTheBoxesThatTheModeAndTheStationAskFor) {
         bool local, optional;
         bool text1, albumBox, required;
     };
-    makePictures(QStringLiteral("C:\\p"), 1);
-    state.album.MailZalam = QStringLiteral("studio@example.com");
+    makePictures(u"C:\\p"_s, 1);
+    state.album.MailZalam = u"studio@example.com"_s;
     for (const Case& c : {Case{1, false, false, true, false, true}, Case{1, false, true, true, false, false},
                           Case{1, true, false, false, false, false}, Case{10, false, false, false, true, true},
                           Case{10, true, false, false, false, false}}) {
@@ -574,7 +572,7 @@ TEST_F(ThePictures, closeWithTheBoxesThatTheModeAndTheStationAskFor) {
         EXPECT_TRUE(page.Command7.visible);
         if (c.albumBox) {
             page.Command8_Click();
-            EXPECT_EQ(state.shemot.Mail, QStringLiteral("studio@example.com"));
+            EXPECT_EQ(state.shemot.Mail, u"studio@example.com"_s);
         }
     }
 }

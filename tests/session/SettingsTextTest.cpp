@@ -7,9 +7,11 @@
 namespace lumora {
 namespace {
 
-const QString defaultText = QStringLiteral(
-    "TK1=0^TK1=0^TK2=zalamim234^ASP=tarvelmond^SRT=192.0.2.10^PAS=morvex482^USR=lumora^SRK=0^STY=30^MNA=56^ZPN=201100^"
-    "D1=0913^D1=1015^D1=1318^D1=1521^D1=2030^D1=3040^D1=3045^D1=4060^D1=5070^D2=1015^D2=1318^");
+using namespace Qt::StringLiterals;
+
+const QString defaultText =
+    u"TK1=0^TK1=0^TK2=zalamim234^ASP=tarvelmond^SRT=192.0.2.10^PAS=morvex482^USR=lumora^SRK=0^STY=30^MNA=56^ZPN=201100^"
+    "D1=0913^D1=1015^D1=1318^D1=1521^D1=2030^D1=3040^D1=3045^D1=4060^D1=5070^D2=1015^D2=1318^"_s;
 
 TEST(SettingsTextTest, WritesTheDefaultProfileInItsFixedOrder) {
     EXPECT_EQ(SettingsText(Deployment().profile), defaultText);
@@ -17,17 +19,17 @@ TEST(SettingsTextTest, WritesTheDefaultProfileInItsFixedOrder) {
 
 TEST(SettingsTextTest, WritesElevenSizesAtMostAndEmptyFieldsAsZero) {
     ClientProfile profile;
-    profile.SizeList.fill(QStringLiteral("10/15"));
+    profile.SizeList.fill(u"10/15"_s);
     const QString text = SettingsText(profile);
-    EXPECT_EQ(text.count(QStringLiteral("D1=1015^")), 11);
-    EXPECT_TRUE(text.startsWith(QStringLiteral("TK1=0^TK1=0^TK2=0^ASP=0^SRT=0^PAS=0^USR=0^SRK=0^STY=0^")));
-    EXPECT_FALSE(text.contains(QStringLiteral("D2=")));
+    EXPECT_EQ(text.count(u"D1=1015^"_s), 11);
+    EXPECT_TRUE(text.startsWith(u"TK1=0^TK1=0^TK2=0^ASP=0^SRT=0^PAS=0^USR=0^SRK=0^STY=0^"_s));
+    EXPECT_FALSE(text.contains(u"D2="_s));
 }
 
 TEST(SettingsTextTest, SplitsIntoAllPiecesButTheFirst) {
     const SettingsPieces split = SplitSettings(defaultText);
     EXPECT_EQ(split.pieces.size(), 21);
-    EXPECT_EQ(split.pieces.count(QStringLiteral("TK1=0")), 1);
+    EXPECT_EQ(split.pieces.count(u"TK1=0"_s), 1);
     EXPECT_EQ(split.pieces.last(), u"D2=1318");
     EXPECT_EQ(split.table[0], u"");
     EXPECT_EQ(split.table[1], u"TK1=0");
@@ -47,31 +49,30 @@ TEST(SettingsTextTest, SplitsOddTextsWithoutLosingTheirPieces) {
         {"a^b^", {"b"}},
         {"a^^b^", {"", "b"}},
         {"^b", {"b"}},
-        {QStringLiteral("p^").repeated(60), QStringList(34, QStringLiteral("p"))},
+        {u"p^"_s.repeated(60), QStringList(34, u"p"_s)},
     };
     for (const auto& c : cases)
         EXPECT_EQ(SplitSettings(c.text).pieces, c.pieces) << c.text.toStdString();
 }
 
 TEST(SettingsTextTest, ScrambleGivesBackWhatIsInTheAlphabetAndDropsTheRest) {
-    const QString alphabet =
-        QStringLiteral("abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ1234567890@*-_\\/+!. ^=");
+    const QString alphabet = u"abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ1234567890@*-_\\/+!. ^="_s;
     ASSERT_EQ(alphabet.size(), 74);
     const QString scrambled = Scramble(alphabet);
     EXPECT_NE(scrambled, alphabet);
     EXPECT_EQ(QSet<QChar>(scrambled.begin(), scrambled.end()).size(), 74) << "two letters share one";
     EXPECT_EQ(Unscramble(scrambled), alphabet);
-    EXPECT_EQ(Scramble(QStringLiteral("abc")), u"oC+");
-    EXPECT_EQ(Unscramble(Scramble(QStringLiteral("a\u05D0,b"))), u"ab");
+    EXPECT_EQ(Scramble(u"abc"_s), u"oC+");
+    EXPECT_EQ(Unscramble(Scramble(u"a\u05D0,b"_s)), u"ab");
     EXPECT_EQ(Unscramble(Unscramble(Scramble(Scramble(defaultText)))), defaultText);
 }
 
 TEST(SettingsTextTest, KnowsTheFieldsOfAnOrderCard) {
-    const auto size = orderCardEntry(SplitSettings(QStringLiteral("GodeDaf^10/15 cm^")));
+    const auto size = orderCardEntry(SplitSettings(u"GodeDaf^10/15 cm^"_s));
     ASSERT_TRUE(size);
     EXPECT_EQ(size->line, u"   גודל דף   10/15 cm");
     EXPECT_EQ(size->number, 10);
-    const auto silent = orderCardEntry(SplitSettings(QStringLiteral("Mor^7")));
+    const auto silent = orderCardEntry(SplitSettings(u"Mor^7"_s));
     ASSERT_TRUE(silent);
     EXPECT_EQ(silent->value, u"7");
     EXPECT_TRUE(silent->line.isEmpty());

@@ -10,6 +10,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class WorkspaceTest : public ::testing::Test {
 protected:
     WorkspaceTest() { state.DiskRoot = machine.drives.programRoot(); }
@@ -29,18 +31,18 @@ protected:
 };
 
 TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
-    state.MisparHazmana = QStringLiteral("77");
+    state.MisparHazmana = u"77"_s;
     make();
-    EXPECT_EQ(machine.files.folders(QStringLiteral("C:\\")), QStringList({"2000lumora", "vedron"}));
+    EXPECT_EQ(machine.files.folders(u"C:\\"_s), QStringList({"2000lumora", "vedron"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::root(state)), QStringList({"!!000", "misgarot", "zmany"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::zmany(state)), QStringList({"job_folder", "ktanim", "tempred"}));
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_EQ(*machine.files.read(QStringLiteral("C:\\2000lumora\\!!000\\mana.txt")), "1\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\!!000\\mana.txt"_s), "1\r\n");
 }
 
 TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
-    put(QStringLiteral("C:\\2000lumora"));
+    put(u"C:\\2000lumora"_s);
     const Result<void> made = workspace.MakeWorkspace();
     ASSERT_FALSE(made.ok());
     EXPECT_TRUE(made.failure().message.contains(u"2000lumora")) << made.failure().message.toStdString();
@@ -68,7 +70,7 @@ TEST_F(WorkspaceTest, TakesWhatItCanOfADamagedCounter) {
     };
     make();
     for (const auto& c : cases) {
-        state.MisparHazmana = QStringLiteral("55");
+        state.MisparHazmana = u"55"_s;
         put(WorkspacePaths::counter(state), c.stored);
         ASSERT_TRUE(workspace.CleanWorkspace().ok());
         EXPECT_EQ(state.MisparHazmana, c.number) << c.stored.toStdString();
@@ -105,25 +107,25 @@ TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
     ASSERT_TRUE(folder);
     const HostPath odd = *folder / "\xE6\xBC\xA2.jpg";
     std::ofstream(odd) << "x";
-    put(QStringLiteral("C:\\2000lumora\\zmany\\ktanim\\z.jpg"));
+    put(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_s);
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     EXPECT_TRUE(std::filesystem::exists(odd));
-    EXPECT_FALSE(machine.files.fileExists(QStringLiteral("C:\\2000lumora\\zmany\\ktanim\\z.jpg")));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_s));
 }
 
 TEST_F(WorkspaceTest, CleansTheHistoryButForTheFirstFileOfEachOrder) {
     make();
-    const QString order = QStringLiteral("C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105");
-    const QString other = QStringLiteral("C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106");
+    const QString order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_s;
+    const QString other = u"C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106"_s;
     ASSERT_TRUE(machine.files.makeFolder(order).ok());
     ASSERT_TRUE(machine.files.makeFolder(other).ok());
     for (const char* name : {"!105_1234.jpp", "1 1015.jpp", "1 1318.JPP", "order.txt", "part.prk"})
         put(order + u'\\' + QString::fromLatin1(name));
-    put(other + QStringLiteral("\\only.jpp"));
+    put(other + u"\\only.jpp"_s);
     workspace.CleanHistory();
-    EXPECT_EQ(machine.files.names(order, QStringLiteral("*")),
+    EXPECT_EQ(machine.files.names(order, u"*"_s),
               QStringList({"!105_1234.jpp", "1 1318.JPP", "order.txt", "part.prk"}));
-    EXPECT_EQ(machine.files.names(other, QStringLiteral("*")), QStringList({"only.jpp"}));
+    EXPECT_EQ(machine.files.names(other, u"*"_s), QStringList({"only.jpp"}));
 }
 
 } // namespace

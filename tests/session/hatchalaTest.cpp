@@ -9,13 +9,15 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // Gives what a settings host would: the bytes of one file, or nothing.
 class SettingsSite : public NoInternet {
 public:
     Result<void> download(const QString& url, const HostPath& target) override {
         urls += url;
         if (answer.isEmpty())
-            return Failure{Failure::Kind::NotFound, QStringLiteral("404")};
+            return Failure{Failure::Kind::NotFound, u"404"_s};
         QFile file(toText(target));
         if (!file.open(QIODevice::WriteOnly) || file.write(answer) != answer.size())
             return Failure{Failure::Kind::Other, file.errorString()};
@@ -28,8 +30,7 @@ public:
 class hatchalaTest : public ::testing::Test {
 protected:
     hatchalaTest() {
-        deployment.profile.Shops = {Shop{QStringLiteral("Haifa"), QStringLiteral("04-1")},
-                                    Shop{QStringLiteral("Yaffo"), QStringLiteral("03-2")}};
+        deployment.profile.Shops = {Shop{u"Haifa"_s, u"04-1"_s}, Shop{u"Yaffo"_s, u"03-2"_s}};
         chain.registerPage(PageId::hatchala,
                            [this] { return std::make_unique<hatchala>(state, machine.platform, chain, deployment); });
         chain.registerPage(PageId::nnn, [] { return std::make_unique<Page>(PageId::nnn); });
@@ -49,8 +50,8 @@ protected:
 TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     state.EnglishTips = 1;
     deployment.SugTzad = 60;
-    deployment.profile.LabPhone = QStringLiteral("09-9");
-    state.handOver.notice = QStringLiteral("order 104 stays here");
+    deployment.profile.LabPhone = u"09-9"_s;
+    state.handOver.notice = u"order 104 stays here"_s;
     hatchala& page = start();
     EXPECT_EQ(state.EnglishTips, 0);
     EXPECT_EQ(state.SugTzad, 60);
@@ -85,8 +86,8 @@ TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
     hatchala& page = start();
     page.Check1_Click(true);
     state.MishloachHabaita = true;
-    state.shemot.Mail = QStringLiteral("earlier@example.com");
-    state.profile.FtpServer = QStringLiteral("changed in the panel");
+    state.shemot.Mail = u"earlier@example.com"_s;
+    state.profile.FtpServer = u"changed in the panel"_s;
     page.Image1_MouseDown();
     page.Image1_MouseDown();
     page.Image1_Click();
@@ -114,7 +115,7 @@ TEST_F(hatchalaTest, TheCountdownStartsByItself) {
 
 TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
     deployment.DeliveryChoiceMode = 1;
-    deployment.profile.LabPhone = QStringLiteral("09-9");
+    deployment.profile.LabPhone = u"09-9"_s;
     QString seenByTheDetails;
     chain.registerPage(PageId::nnn, [&] {
         seenByTheDetails = state.profile.LabPhone;
@@ -139,7 +140,7 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
         EXPECT_EQ(page.Picture1Width, 230);
         EXPECT_FALSE(page.Timer3.running());
         state.MishloachHabaita = true;
-        state.shemot.Mail = QStringLiteral("earlier@example.com");
+        state.shemot.Mail = u"earlier@example.com"_s;
         page.List1_Click(c.row);
         ASSERT_EQ(chain.front()->id(), PageId::nnn);
         EXPECT_EQ(state.KodMishloach, c.code);
@@ -177,7 +178,7 @@ TEST_F(hatchalaTest, TheQuestionOfTheShopCanBePutOff) {
 
 TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
     hatchala& page = start();
-    state.profile.SiteUrl = QStringLiteral("changed");
+    state.profile.SiteUrl = u"changed"_s;
     page.Image11_Click();
     page.Image8_Click();
     EXPECT_EQ(machine.shell.webPages,
@@ -213,7 +214,7 @@ TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
 TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade) {
     hatchala& page = start();
     site.answer = "picture";
-    ASSERT_TRUE(machine.files.writeWhole(QStringLiteral("C:\\2000lumora"), "a file in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "a file in the way").ok());
     page.Timer1_Tick();
     EXPECT_EQ(page.Picture4, QString());
     std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
@@ -239,7 +240,7 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     page.DownloadSettings();
     page.Command5_Click();
     EXPECT_EQ(page.List4pices.count(), 21);
-    const QString path = QStringLiteral("C:\\2000lumora\\tarvelmond.txt");
+    const QString path = u"C:\\2000lumora\\tarvelmond.txt"_s;
     EXPECT_EQ(machine.files.read(path)->size(), 203);
     const QString text = page.Label5.text;
     page.Command4_Click();
@@ -257,7 +258,7 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     EXPECT_EQ(site.urls.last(), u"http://settings.lumora.example/00natoonim/tarvelmond.txt");
     EXPECT_EQ(page.List2.items(), QStringList({"TK1=0^TK1=5^X=1^", "second"}));
     EXPECT_EQ(page.List4pices.items(), QStringList({"TK1=5", "X=1"}));
-    page.ReadSettingsFile(QStringLiteral("C:\\2000lumora\\other.txt"));
+    page.ReadSettingsFile(u"C:\\2000lumora\\other.txt"_s);
     EXPECT_EQ(machine.dialogs.messages.last(), u"No Server");
     EXPECT_TRUE(page.List2.isEmpty());
 }

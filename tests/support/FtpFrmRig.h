@@ -13,6 +13,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // A prepared order on the disk and the sending page in front of it, over the line that the test brings.
 class FtpFrmRig {
 public:
@@ -21,19 +23,19 @@ public:
     explicit FtpFrmRig(Internet& line)
         : test(line)
         , chain(test.pump) {
-        state.DiskRoot = QStringLiteral("C:\\");
-        state.MisparHazmana = QStringLiteral("105");
-        state.KodMishloach = QStringLiteral("KUP");
+        state.DiskRoot = u"C:\\"_s;
+        state.MisparHazmana = u"105"_s;
+        state.KodMishloach = u"KUP"_s;
         state.Optint = 1;
         state.transfer.OrderFolder = folder();
         ClientProfile& profile = state.profile;
-        profile.FtpServer = QStringLiteral("192.0.2.10");
-        profile.FtpUser = QStringLiteral("lumora");
-        profile.FtpPassword = QStringLiteral("morvex482");
-        profile.FtpFolder2 = QStringLiteral("zalamim234");
-        profile.ClientCode = QStringLiteral("tarvelmond");
-        profile.ReportUrl = QStringLiteral("http://192.0.2.10/aaaqamootreport/padd.asp");
-        profile.DoneUrl = QStringLiteral("http://192.0.2.10/aaasssppp/p.asp");
+        profile.FtpServer = u"192.0.2.10"_s;
+        profile.FtpUser = u"lumora"_s;
+        profile.FtpPassword = u"morvex482"_s;
+        profile.FtpFolder2 = u"zalamim234"_s;
+        profile.ClientCode = u"tarvelmond"_s;
+        profile.ReportUrl = u"http://192.0.2.10/aaaqamootreport/padd.asp"_s;
+        profile.DoneUrl = u"http://192.0.2.10/aaasssppp/p.asp"_s;
         profile.ReportOn = 1;
         for (const char* name : {"C:\\2000lumora", "C:\\2000lumora\\!!000"})
             (void)test.files.makeFolder(QString::fromLatin1(name));
@@ -45,41 +47,41 @@ public:
         addPages();
     }
 
-    static QString name() { return QStringLiteral("2026_11_21_KUP_1234^105"); }
-    static QString folder() { return QStringLiteral("C:\\2000lumora\\!!000\\") + name(); }
-    static QString log() { return name() + QStringLiteral(".txt"); }
-    static QString sheet() { return QStringLiteral("!105_1234.jpp"); }
-    static QString first() { return QStringLiteral("021015GNB0000_03AABB.jpp"); }
-    static QString second() { return QStringLiteral("111015GNB0001_03AACC.jpp"); }
-    static QString proof() { return QStringLiteral("000.jpg"); }
+    static QString name() { return u"2026_11_21_KUP_1234^105"_s; }
+    static QString folder() { return u"C:\\2000lumora\\!!000\\"_s + name(); }
+    static QString log() { return name() + u".txt"_s; }
+    static QString sheet() { return u"!105_1234.jpp"_s; }
+    static QString first() { return u"021015GNB0000_03AABB.jpp"_s; }
+    static QString second() { return u"111015GNB0001_03AACC.jpp"_s; }
+    static QString proof() { return u"000.jpg"_s; }
     // The order in which they travel.
     static QStringList names() { return {log(), sheet(), first(), second(), proof()}; }
-    static QString remoteFolder() { return QStringLiteral("zalamim234/") + name(); }
+    static QString remoteFolder() { return u"zalamim234/"_s + name(); }
     static QString local(const QString& leaf) { return folder() + u'\\' + leaf; }
 
     void write(const QString& leaf, const QByteArray& bytes) { (void)test.files.writeWhole(local(leaf), bytes); }
 
     void writeLog() {
         ListOutput out;
-        out.pair(QStringLiteral("00"), QStringLiteral("00"));
-        out.pair(QStringLiteral("Shemot.n1"), QStringLiteral("דנה לוי"));
-        out.pair(QStringLiteral("Shemot.n2"), QStringLiteral("03-1234567"));
-        out.text(QStringLiteral("Shemot.TotalPics")).number(13).endLine();
-        out.pair(QStringLiteral("Shemot.Mail"), QStringLiteral("dana@example.com"));
-        out.pair(QStringLiteral("Shemot.Hearot"), QStringLiteral("gift, \"big\" - "));
-        out.pair(QStringLiteral("Shemot.ppr"), QStringLiteral("10/15"));
-        out.pair(QStringLiteral("Shemot.Bord"), QStringLiteral("NB"));
-        out.pair(QStringLiteral("Shemot.maat"), QStringLiteral("מבריק"));
-        out.pair(QStringLiteral("Shemot.FillFit"), QStringLiteral("FIT"));
+        out.pair(u"00"_s, u"00"_s);
+        out.pair(u"Shemot.n1"_s, u"דנה לוי"_s);
+        out.pair(u"Shemot.n2"_s, u"03-1234567"_s);
+        out.text(u"Shemot.TotalPics"_s).number(13).endLine();
+        out.pair(u"Shemot.Mail"_s, u"dana@example.com"_s);
+        out.pair(u"Shemot.Hearot"_s, u"gift, \"big\" - "_s);
+        out.pair(u"Shemot.ppr"_s, u"10/15"_s);
+        out.pair(u"Shemot.Bord"_s, u"NB"_s);
+        out.pair(u"Shemot.maat"_s, u"מבריק"_s);
+        out.pair(u"Shemot.FillFit"_s, u"FIT"_s);
         write(log(), out.bytes());
     }
 
     // What the local folder and the summary's picture hold, by leaf name.
     std::map<QString, QByteArray> localFiles() const {
         std::map<QString, QByteArray> bytes;
-        for (const QString& leaf : test.files.names(folder(), QStringLiteral("*.*")))
+        for (const QString& leaf : test.files.names(folder(), u"*.*"_s))
             bytes[leaf] = *test.files.read(local(leaf));
-        const QString proofPath = QStringLiteral("C:\\2000lumora\\000.jpg");
+        const QString proofPath = u"C:\\2000lumora\\000.jpg"_s;
         if (test.files.fileExists(proofPath))
             bytes[proof()] = *test.files.read(proofPath);
         return bytes;

@@ -12,6 +12,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // A bad line: stands in front of a server on 127.0.0.1, passes everything on, and makes the faults it is told to. In
 // front of an FTP server it also carries the data connections, by putting ports of its own into the answers to EPSV and
 // PASV.
@@ -37,7 +39,7 @@ public:
     TcpRelay& operator=(const TcpRelay&) = delete;
 
     quint16 port() const { return m_port; }
-    QString host() const { return QStringLiteral("127.0.0.1:%1").arg(m_port); }
+    QString host() const { return u"127.0.0.1:%1"_s.arg(m_port); }
 
     // For what happens from now on.
     void setFaults(const Faults& faults);

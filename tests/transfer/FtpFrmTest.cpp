@@ -7,14 +7,16 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-const QString uploaded = QStringLiteral("הקבצים הועלו בהצלחה");
-const QString notAll = QStringLiteral("לא כל הקבצים הועלו");
+const QString uploaded = u"הקבצים הועלו בהצלחה"_s;
+const QString notAll = u"לא כל הקבצים הועלו"_s;
 
 class FtpFrmTest : public ::testing::Test {
 protected:
-    FtpFrmTest() { lab.folders[QStringLiteral("zalamim234")]; }
+    FtpFrmTest() { lab.folders[u"zalamim234"_s]; }
 
     FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
 
@@ -79,7 +81,7 @@ TEST_P(EndStates, AreTheOnesThatTheCustomerIsTold) {
         EXPECT_EQ(page.caption, uploaded);
         expectArrived();
     } else {
-        EXPECT_EQ(page.Label33.text, QStringLiteral("10"));
+        EXPECT_EQ(page.Label33.text, u"10"_s);
         EXPECT_FALSE(page.Label2.text.isEmpty());
         EXPECT_FALSE(page.sending);
     }
@@ -147,9 +149,9 @@ INSTANTIATE_TEST_SUITE_P(
 TEST_F(FtpFrmTest, CountsTheMissingFilesBesideTheNumberOfTheDesign) {
     lab.putFaults = {{FtpFrmRig::first(), FakeLab::always, -1}, {FtpFrmRig::second(), FakeLab::always, 50}};
     rig.send();
-    EXPECT_EQ(rig.page().Label31.text, QStringLiteral("0"));
-    EXPECT_EQ(rig.page().Label4Missing.text, QStringLiteral("2"));
-    EXPECT_EQ(rig.page().Label12.text, QStringLiteral("5"));
+    EXPECT_EQ(rig.page().Label31.text, u"0"_s);
+    EXPECT_EQ(rig.page().Label4Missing.text, u"2"_s);
+    EXPECT_EQ(rig.page().Label12.text, u"5"_s);
     EXPECT_FALSE(remote().contains(FtpFrmRig::second()));
 }
 
@@ -158,7 +160,7 @@ TEST_F(FtpFrmTest, SendsAfterTheFifteenthSecondAndOnlyOnce) {
     EXPECT_TRUE(page.Timer1.running());
     for (int tick = 0; tick < 14; ++tick)
         page.Timer1_Tick();
-    EXPECT_EQ(page.Label20.text, QStringLiteral("1"));
+    EXPECT_EQ(page.Label20.text, u"1"_s);
     EXPECT_TRUE(lab.puts.isEmpty());
     page.Timer1_Tick();
     EXPECT_EQ(lab.puts, FtpFrmRig::names());
@@ -172,7 +174,7 @@ TEST_F(FtpFrmTest, CountdownStopsAndGoesOn) {
     FtpFrm& page = rig.start();
     page.Command23_Click();
     EXPECT_FALSE(page.Timer1.running());
-    EXPECT_EQ(page.Command23.text, QStringLiteral("המשך"));
+    EXPECT_EQ(page.Command23.text, u"המשך"_s);
     page.Command23_Click();
     EXPECT_TRUE(page.Timer1.running());
     page.Image3_Click();
@@ -188,13 +190,12 @@ TEST_F(FtpFrmTest, CountdownStopsAndGoesOn) {
 
 TEST_F(FtpFrmTest, TellsTheLabsSiteInThreeCallsInOrder) {
     rig.send();
-    const QString site = QStringLiteral("http://192.0.2.10/");
-    EXPECT_EQ(lab.urls, (QStringList{site + QStringLiteral("aaaqamootreport/padd.aspc.txt"),
-                                     site + QStringLiteral(
-                                                "aaaqamootreport/padd.asp?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    "
-                                                "10_15G_FIT_NB&t2=Notes: gift, \"big\" - &t3=Pratim: 03-1234567    דנה "
-                                                "לוי&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"),
-                                     site + QStringLiteral("aaasssppp/p.asp?t1=tarvelmond&t2=true")}));
+    const QString site = u"http://192.0.2.10/"_s;
+    EXPECT_EQ(lab.urls, (QStringList{site + u"aaaqamootreport/padd.aspc.txt"_s,
+                                     site + u"aaaqamootreport/padd.asp?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    "
+                                            "10_15G_FIT_NB&t2=Notes: gift, \"big\" - &t3=Pratim: 03-1234567    דנה "
+                                            "לוי&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"_s,
+                                     site + u"aaasssppp/p.asp?t1=tarvelmond&t2=true"_s}));
 }
 
 TEST_F(FtpFrmTest, SendsNoReportsWhenTheLabWantsNone) {
@@ -208,7 +209,7 @@ TEST_F(FtpFrmTest, SendsNoReportsWhenTheLabWantsNone) {
 TEST_F(FtpFrmTest, StopsAndGoesOnWhereItStopped) {
     for (const QString& stopAt : {FtpFrmRig::first(), FtpFrmRig::proof()}) {
         FakeLab line;
-        line.folders[QStringLiteral("zalamim234")];
+        line.folders[u"zalamim234"_s];
         FtpFrmRig order(line);
         line.onPut = [&](const QString& name) {
             if (name == stopAt)
@@ -220,7 +221,7 @@ TEST_F(FtpFrmTest, StopsAndGoesOnWhereItStopped) {
         EXPECT_EQ(line.puts.size(), expected);
         EXPECT_EQ(page.AllDone, 0);
         ASSERT_EQ(order.test.dialogs.messages.size(), 2);
-        EXPECT_EQ(order.test.dialogs.messages.first(), QStringLiteral(" התהליך הופסק ביוזמת המשתמש "));
+        EXPECT_EQ(order.test.dialogs.messages.first(), u" התהליך הופסק ביוזמת המשתמש "_s);
         EXPECT_EQ(page.pageSize, FtpBoard::PageSize::Full);
         EXPECT_TRUE(page.Command10.visible);
         EXPECT_TRUE(line.urls.isEmpty());
@@ -263,7 +264,7 @@ TEST_F(FtpFrmTest, EndsAtOnceWhenTheProgramIsClosedInTheMiddle) {
 TEST_F(FtpFrmTest, EndsAtOnceWhenTheWindowIsClosedOrThePageUnloadedInTheMiddle) {
     for (const bool closed : {true, false}) {
         FakeLab line;
-        line.folders[QStringLiteral("zalamim234")];
+        line.folders[u"zalamim234"_s];
         FtpFrmRig order(line);
         line.onPut = [&](const QString& name) {
             if (name != FtpFrmRig::sheet())
@@ -284,12 +285,12 @@ TEST_F(FtpFrmTest, EndsAtOnceWhenTheWindowIsClosedOrThePageUnloadedInTheMiddle) 
 TEST_F(FtpFrmTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
     for (const bool inCheck : {false, true}) {
         FakeLab line;
-        line.folders[QStringLiteral("zalamim234")];
+        line.folders[u"zalamim234"_s];
         FtpFrmRig order(line);
         line.deadConnects = FakeLab::always;
         int stoppedAt = 0;
         line.onConnect = [&](int number) {
-            const bool now = inCheck ? !order.page().Label4Do.text.startsWith(QStringLiteral("ההזמנה")) : number == 2;
+            const bool now = inCheck ? !order.page().Label4Do.text.startsWith(u"ההזמנה"_s) : number == 2;
             if (stoppedAt == 0 && now) {
                 stoppedAt = number;
                 order.page().Command15_Click();
@@ -300,7 +301,7 @@ TEST_F(FtpFrmTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
         EXPECT_GT(stoppedAt, 0);
         EXPECT_EQ(line.connects, stoppedAt);
         EXPECT_EQ(order.test.dialogs.messages.size(), 2);
-        EXPECT_TRUE(page.Label4Do.text.startsWith(QStringLiteral("השליחה נעצרה")));
+        EXPECT_TRUE(page.Label4Do.text.startsWith(u"השליחה נעצרה"_s));
         // "Close", "do not close": what was stopped stays so.
         page.Image3_Click();
         page.Command14_Click();
@@ -327,7 +328,7 @@ TEST_F(FtpFrmTest, IgnoresAStartBeforeTheOrderIsListed) {
 
 // More names on the server than the order has files: no verdict, and all is looked at four times.
 TEST_F(FtpFrmTest, GivesNoVerdictOnAFolderThatHoldsMore) {
-    remote()[QStringLiteral("stranger.jpp")] = "x";
+    remote()[u"stranger.jpp"_s] = "x";
     rig.send();
     FtpFrm& page = rig.page();
     EXPECT_EQ(page.Label34.text, QString::fromUtf8(fourth));
@@ -335,7 +336,7 @@ TEST_F(FtpFrmTest, GivesNoVerdictOnAFolderThatHoldsMore) {
     EXPECT_FALSE(page.Picture2.visible);
     EXPECT_EQ(page.AllDone, 0);
     EXPECT_EQ(page.pageSize, FtpBoard::PageSize::Full);
-    EXPECT_EQ(page.Label3.text, QStringLiteral("6 קבצים שהועלו בהצלחה "));
+    EXPECT_EQ(page.Label3.text, u"6 קבצים שהועלו בהצלחה "_s);
     EXPECT_TRUE(rig.test.dialogs.messages.isEmpty());
     EXPECT_EQ(lab.puts.size(), 5);
 }
@@ -347,23 +348,23 @@ TEST_F(FtpFrmTest, EndsInSilenceWhenANameStandsTwiceInTheOrder) {
     EXPECT_EQ(rig.page().NumToSend, 3);
     EXPECT_EQ(rig.page().AllDone, 0);
     EXPECT_FALSE(rig.page().Picture6.visible);
-    EXPECT_EQ(rig.page().Label3.text, QStringLiteral("2 קבצים שהועלו בהצלחה "));
-    EXPECT_TRUE(rig.page().Label4Do.text.contains(QStringLiteral("2 מתוך 3")));
+    EXPECT_EQ(rig.page().Label3.text, u"2 קבצים שהועלו בהצלחה "_s);
+    EXPECT_TRUE(rig.page().Label4Do.text.contains(u"2 מתוך 3"_s));
     EXPECT_EQ(lab.puts.size(), 2);
 }
 
 TEST_F(FtpFrmTest, TakesTheLinesOfAResendAndForgetsTheCustomerBefore) {
     rig.chain.show(PageId::MoogMeret);
     rig.state.transfer.SugMishloah = 1;
-    rig.state.shemot.Mail = QStringLiteral("other@example.com");
+    rig.state.shemot.Mail = u"other@example.com"_s;
     (void)rig.test.files.writeWhole(FtpFrmRig::local(FtpFrmRig::log()), "\"Shemot.n1\",\"Dana\"\r\n");
     rig.state.handOver.lines = {FtpFrmRig::local(FtpFrmRig::log()), FtpFrmRig::local(FtpFrmRig::second())};
     FtpFrm& page = rig.start();
     EXPECT_EQ(rig.chain.find(PageId::MoogMeret), nullptr);
-    EXPECT_EQ(page.Label7.text, QStringLiteral("2"));
+    EXPECT_EQ(page.Label7.text, u"2"_s);
     EXPECT_EQ(rig.state.shemot.Mail, QString());
-    EXPECT_EQ(rig.state.shemot.n1, QStringLiteral("Dana"));
-    EXPECT_EQ(page.Label21.text, QStringLiteral("11"));
+    EXPECT_EQ(rig.state.shemot.n1, u"Dana"_s);
+    EXPECT_EQ(page.Label21.text, u"11"_s);
     EXPECT_TRUE(rig.state.handOver.lines.isEmpty());
     rig.countDown();
     EXPECT_EQ(page.AllDone, 1);
@@ -387,7 +388,7 @@ TEST_F(FtpFrmTest, AResendSendsWhatAnEarlierRunBroke) {
     EXPECT_EQ(rig.page().Label3.text, uploaded);
     EXPECT_EQ(lab.puts, QStringList(FtpFrmRig::first()));
     EXPECT_EQ(remote()[FtpFrmRig::first()], rig.localFiles().at(FtpFrmRig::first()));
-    EXPECT_EQ(rig.localFiles().at(QStringLiteral("kashloo.txt")), QByteArray());
+    EXPECT_EQ(rig.localFiles().at(u"kashloo.txt"_s), QByteArray());
 }
 
 TEST_F(FtpFrmTest, WritesTheBrokenFilesOneALine) {
@@ -396,16 +397,16 @@ TEST_F(FtpFrmTest, WritesTheBrokenFilesOneALine) {
     QByteArray seen;
     lab.onPut = [&](const QString& name) {
         if (name == FtpFrmRig::proof())
-            seen = rig.localFiles().at(QStringLiteral("kashloo.txt"));
+            seen = rig.localFiles().at(u"kashloo.txt"_s);
     };
     rig.send();
-    EXPECT_EQ(seen, (FtpFrmRig::local(FtpFrmRig::first()) + QStringLiteral("\r\n") +
-                     FtpFrmRig::local(FtpFrmRig::second()) + QStringLiteral("\r\n"))
-                        .toLatin1());
+    EXPECT_EQ(seen,
+              (FtpFrmRig::local(FtpFrmRig::first()) + u"\r\n"_s + FtpFrmRig::local(FtpFrmRig::second()) + u"\r\n"_s)
+                  .toLatin1());
 }
 
 TEST_F(FtpFrmTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
-    lab.folders[QStringLiteral("zalamim234")][FtpFrmRig::first()] = "another's file";
+    lab.folders[u"zalamim234"_s][FtpFrmRig::first()] = "another's file";
     lab.putFaults = {{FtpFrmRig::first(), 1, 60}};
     int sinceCut = 0;
     lab.onConnect = [&](int) {
@@ -415,7 +416,7 @@ TEST_F(FtpFrmTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
         lab.refusesEntry = ++sinceCut == 1;
     };
     rig.send();
-    EXPECT_EQ(lab.folders[QStringLiteral("zalamim234")][FtpFrmRig::first()], QByteArray("another's file"));
+    EXPECT_EQ(lab.folders[u"zalamim234"_s][FtpFrmRig::first()], QByteArray("another's file"));
     EXPECT_EQ(rig.page().Label3.text, uploaded);
     expectArrived();
 }
@@ -424,18 +425,18 @@ TEST_F(FtpFrmTest, WithoutItsTextTheOrderSendsThePicturesAndSaysSo) {
     (void)rig.test.files.removeFile(FtpFrmRig::local(FtpFrmRig::log()));
     rig.send();
     EXPECT_EQ(lab.puts, FtpFrmRig::names().mid(1));
-    EXPECT_TRUE(rig.page().Picture2Lines.contains(QStringLiteral("NO details")));
+    EXPECT_TRUE(rig.page().Picture2Lines.contains(u"NO details"_s));
     EXPECT_EQ(rig.page().AllDone, 1);
 }
 
 TEST_F(FtpFrmTest, ListsNothingWithoutAnOrder) {
-    for (const QString& folder : {QString(), QStringLiteral("***")}) {
+    for (const QString& folder : {QString(), u"***"_s}) {
         FtpFrmRig order(lab);
         order.state.transfer.OrderFolder = folder;
         FtpFrm& page = order.start();
         EXPECT_TRUE(page.List3.isEmpty());
         EXPECT_FALSE(page.Timer1.running());
-        EXPECT_EQ(page.Label4Do.text, QStringLiteral("אין כאן הזמנה לשליחה."));
+        EXPECT_EQ(page.Label4Do.text, u"אין כאן הזמנה לשליחה."_s);
     }
 }
 
@@ -444,17 +445,17 @@ TEST_F(FtpFrmTest, ShowsTwoBoxesWhenNoServerIsNamed) {
     FtpFrm& page = rig.start();
     EXPECT_TRUE(page.Command28.visible);
     EXPECT_EQ(rig.test.dialogs.messages.size(), 2);
-    EXPECT_TRUE(rig.test.dialogs.messages.value(1).endsWith(QStringLiteral("  ש ל י ח ה    ח ו ז ר ת  ")));
+    EXPECT_TRUE(rig.test.dialogs.messages.value(1).endsWith(u"  ש ל י ח ה    ח ו ז ר ת  "_s));
     EXPECT_FALSE(page.Timer1.running());
 }
 
 TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
     rig.state.transfer.Mefurak = 1;
-    rig.write(QStringLiteral("a_001_002.prk"), "1");
-    rig.write(QStringLiteral("a_002_002.prk"), "2");
+    rig.write(u"a_001_002.prk"_s, "1");
+    rig.write(u"a_002_002.prk"_s, "2");
     rig.send();
-    EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::sheet(), QStringLiteral("a_001_002.prk"),
-                                     QStringLiteral("a_002_002.prk"), FtpFrmRig::proof()}));
+    EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::sheet(), u"a_001_002.prk"_s, u"a_002_002.prk"_s,
+                                     FtpFrmRig::proof()}));
     EXPECT_EQ(rig.page().PicInProgKatanWidth, FtpBoard::Pic4ProgWidth);
     EXPECT_EQ(rig.page().AllDone, 1);
 }
@@ -462,12 +463,12 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
 TEST_F(FtpFrmTest, WithoutASheetThePutOfTheFolderItselfFails) {
     rig.state.transfer.Mefurak = 1;
     (void)rig.test.files.removeFile(FtpFrmRig::local(FtpFrmRig::sheet()));
-    rig.write(QStringLiteral("a_001_001.prk"), "1");
+    rig.write(u"a_001_001.prk"_s, "1");
     FtpFrm& page = rig.start();
     EXPECT_EQ(page.List3.item(1), FtpFrmRig::folder() + u'\\');
     rig.countDown();
     EXPECT_EQ(page.Label3.text, notAll);
-    EXPECT_EQ(page.Label4Missing.text, QStringLiteral("1"));
+    EXPECT_EQ(page.Label4Missing.text, u"1"_s);
     EXPECT_TRUE(page.List7.contains(FtpFrmRig::folder() + u'\\'));
 }
 
@@ -476,12 +477,12 @@ TEST_F(FtpFrmTest, AnEmptyFolderOnTheServerCountsAsOneFile) {
     lab.putFaults = {{QString(), FakeLab::always, -1}};
     QStringList counts;
     QObject::connect(&rig.start(), &Page::changed, [&] {
-        if (rig.page().Label3.text.endsWith(QStringLiteral(" קבצים שהועלו בהצלחה ")))
+        if (rig.page().Label3.text.endsWith(u" קבצים שהועלו בהצלחה "_s))
             counts += rig.page().Label3.text.left(1);
     });
     rig.countDown();
-    EXPECT_TRUE(counts.contains(QStringLiteral("1")));
-    EXPECT_EQ(rig.page().Label4Missing.text, QStringLiteral("5"));
+    EXPECT_TRUE(counts.contains(u"1"_s));
+    EXPECT_EQ(rig.page().Label4Missing.text, u"5"_s);
 }
 
 TEST_F(FtpFrmTest, BothEndStatesLeadToANewOrder) {
@@ -501,11 +502,11 @@ TEST_F(FtpFrmTest, ClosesAtOnceWhenAllHasArrived) {
 TEST_F(FtpFrmTest, ShowsTheDeliveryNoteForHomeOrdersAlone) {
     EXPECT_FALSE(rig.start().Label15.visible);
     FtpFrmRig home(lab);
-    home.state.KodMishloach = QStringLiteral("HOM");
-    home.state.shemot.n3 = QStringLiteral("Herzl 1");
+    home.state.KodMishloach = u"HOM"_s;
+    home.state.shemot.n3 = u"Herzl 1"_s;
     FtpFrm& page = home.start();
     EXPECT_TRUE(page.Label15.visible);
-    EXPECT_EQ(page.Label4Ktovet.text, QStringLiteral("Herzl 1"));
+    EXPECT_EQ(page.Label4Ktovet.text, u"Herzl 1"_s);
 }
 
 TEST_F(FtpFrmTest, SpeaksNoHebrewOnAnEnglishPage) {
@@ -524,7 +525,7 @@ TEST_F(FtpFrmTest, SpeaksNoHebrewOnAnEnglishPage) {
         }
     });
     rig.countDown();
-    EXPECT_EQ(page.Label3.text, QStringLiteral("Not all the files were uploaded"));
+    EXPECT_EQ(page.Label3.text, u"Not all the files were uploaded"_s);
     EXPECT_TRUE(found.isEmpty()) << found.join(u'\n').toStdString();
     for (const Caption* control : {&page.Command10, &page.Command28, &page.Picture7, &page.Label4Hamtana, &page.Label9})
         EXPECT_FALSE(hebrew(control->text)) << control->text.toStdString();
@@ -536,14 +537,14 @@ TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {
     EXPECT_FALSE(page.Timer1.running());
     remote()[FtpFrmRig::first()] = rig.localFiles().at(FtpFrmRig::first());
     page.ListRezefFiles.append(FtpFrmRig::name());
-    page.ListRezefFiles.append(QStringLiteral("none^1"));
+    page.ListRezefFiles.append(u"none^1"_s);
     page.Command19_Click();
-    EXPECT_EQ(page.Label3.text, QStringLiteral("  סיים  "));
-    EXPECT_EQ(page.Label4siem.text, QStringLiteral("2 / 2"));
+    EXPECT_EQ(page.Label3.text, u"  סיים  "_s);
+    EXPECT_EQ(page.Label4siem.text, u"2 / 2"_s);
     EXPECT_EQ(lab.puts.size(), 3);
     EXPECT_EQ(page.AllDone, 1);
     ASSERT_EQ(lab.urls.size(), 3);
-    EXPECT_TRUE(lab.urls.at(1).endsWith(QStringLiteral("padd.asp")));
+    EXPECT_TRUE(lab.urls.at(1).endsWith(u"padd.asp"_s));
 }
 
 TEST_F(FtpFrmTest, TheOlderBulkPathSendsInRounds) {
@@ -554,7 +555,7 @@ TEST_F(FtpFrmTest, TheOlderBulkPathSendsInRounds) {
     FtpFrm& page = rig.start();
     page.Command2_Click();
     EXPECT_EQ(page.Label3.text, uploaded);
-    EXPECT_EQ(page.Label4.text, QStringLiteral("1"));
+    EXPECT_EQ(page.Label4.text, u"1"_s);
     EXPECT_EQ(lab.puts.size(), 6);
     EXPECT_EQ(lab.urls.size(), 3);
 }
@@ -562,14 +563,14 @@ TEST_F(FtpFrmTest, TheOlderBulkPathSendsInRounds) {
 TEST_F(FtpFrmTest, TheManualPanelPutsGetsAndDeletes) {
     FtpFrm& page = rig.start();
     page.Command3_Click();
-    EXPECT_EQ(rig.test.dialogs.messages.last(), QStringLiteral("Not in session"));
+    EXPECT_EQ(rig.test.dialogs.messages.last(), u"Not in session"_s);
     page.cmdInternetOpen_Click();
     page.Command3_Click();
-    EXPECT_EQ(rig.test.dialogs.messages.last(), QStringLiteral("Please select a local file to put"));
+    EXPECT_EQ(rig.test.dialogs.messages.last(), u"Please select a local file to put"_s);
     page.File1_Click(page.File1.names().indexOf(FtpFrmRig::first()));
     page.Command3_Click();
     page.Command5_Click();
-    EXPECT_EQ(rig.test.dialogs.messages.last(), QStringLiteral("Please select the item to GET!"));
+    EXPECT_EQ(rig.test.dialogs.messages.last(), u"Please select the item to GET!"_s);
     page.List2_Click(page.List2.find(FtpFrmRig::first()));
     rig.write(FtpFrmRig::first(), "lost");
     page.Command5_Click();
@@ -577,10 +578,10 @@ TEST_F(FtpFrmTest, TheManualPanelPutsGetsAndDeletes) {
     page.Command6_Click();
     EXPECT_FALSE(lab.folders[QString()].contains(FtpFrmRig::first()));
     page.Command7_Click();
-    EXPECT_TRUE(page.List2.contains(QStringLiteral("goop")));
+    EXPECT_TRUE(page.List2.contains(u"goop"_s));
     page.cmdClosehOpen_Click();
     page.Command7_Click();
-    EXPECT_EQ(rig.test.dialogs.messages.last(), QStringLiteral("Not in session"));
+    EXPECT_EQ(rig.test.dialogs.messages.last(), u"Not in session"_s);
 }
 
 } // namespace lumora

@@ -12,34 +12,36 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 SessionState orderOfDana() {
     SessionState state;
-    state.profile.ClientCode = QStringLiteral("tarvelmond");
-    state.transfer.ShemTikiya = QStringLiteral("2026_11_21_KUP_1234^105");
-    state.shemot.n1 = QStringLiteral("Dana Levi");
-    state.shemot.n2 = QStringLiteral("03-1234567");
-    state.shemot.Mail = QStringLiteral("dana@example.com");
-    state.shemot.Hearot = QStringLiteral("gift - ");
-    state.shemot.ppr = QStringLiteral("10/15");
-    state.shemot.maat = QStringLiteral("מבריק");
-    state.shemot.FillFit = QStringLiteral("FIT");
-    state.shemot.Bord = QStringLiteral("NB");
+    state.profile.ClientCode = u"tarvelmond"_s;
+    state.transfer.ShemTikiya = u"2026_11_21_KUP_1234^105"_s;
+    state.shemot.n1 = u"Dana Levi"_s;
+    state.shemot.n2 = u"03-1234567"_s;
+    state.shemot.Mail = u"dana@example.com"_s;
+    state.shemot.Hearot = u"gift - "_s;
+    state.shemot.ppr = u"10/15"_s;
+    state.shemot.maat = u"מבריק"_s;
+    state.shemot.FillFit = u"FIT"_s;
+    state.shemot.Bord = u"NB"_s;
     state.shemot.TotalPics = 13;
     return state;
 }
 
-const QString reportOfDana = QStringLiteral(
-    "?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    10_15G_FIT_NB&t2=Notes: gift - &t3=Pratim: 03-1234567    Dana "
-    "Levi&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13");
+const QString reportOfDana =
+    u"?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    10_15G_FIT_NB&t2=Notes: gift - &t3=Pratim: 03-1234567    Dana "
+    "Levi&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"_s;
 
 } // namespace
 
 TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
     SessionState state = orderOfDana();
     EXPECT_EQ(OrderReportQuery(state), reportOfDana);
-    EXPECT_EQ(DoneQuery(state), QStringLiteral("?t1=tarvelmond&t2=true"));
+    EXPECT_EQ(DoneQuery(state), u"?t1=tarvelmond&t2=true"_s);
     state.transfer.SugMishloah = 1;
     EXPECT_EQ(OrderReportQuery(state), reportOfDana);
     state.transfer.SugMishloah = 2;
@@ -49,59 +51,59 @@ TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
 
 TEST(OrderReport, KeepsEveryCharacterButLineBreaks) {
     SessionState state = orderOfDana();
-    state.shemot.Hearot = QStringLiteral("a&b#c%20\r\nGET /") + QChar(u'\0') + u'x';
-    EXPECT_TRUE(OrderReportQuery(state).contains(QStringLiteral("Notes: a&b#c%20  GET / x&t3=")));
+    state.shemot.Hearot = u"a&b#c%20\r\nGET /"_s + QChar(u'\0') + u'x';
+    EXPECT_TRUE(OrderReportQuery(state).contains(u"Notes: a&b#c%20  GET / x&t3="_s));
 }
 
 TEST(OrderReport, OverlapsTheEndsOfAShortPaperText) {
     SessionState state = orderOfDana();
-    state.shemot.ppr = QStringLiteral("9/5");
+    state.shemot.ppr = u"9/5"_s;
     state.shemot.maat.clear();
-    EXPECT_TRUE(OrderReportQuery(state).contains(QStringLiteral("    9/_/5_FIT_NB&")));
+    EXPECT_TRUE(OrderReportQuery(state).contains(u"    9/_/5_FIT_NB&"_s));
 }
 
 TEST(OrderReport, KnowsThePaperKindsOfBothLanguages) {
-    for (const QString& word : {QStringLiteral("מט"), QStringLiteral("MAT"), QStringLiteral("Matte")})
-        EXPECT_EQ(PaperKindLetter(word), QStringLiteral("M")) << word.toStdString();
-    for (const QString& word : {QStringLiteral("מבריק"), QStringLiteral("GLOSSY"), QStringLiteral("Glossy")})
-        EXPECT_EQ(PaperKindLetter(word), QStringLiteral("G")) << word.toStdString();
-    for (const QString& word : {QString(), QStringLiteral("***"), QStringLiteral("M")})
+    for (const QString& word : {u"מט"_s, u"MAT"_s, u"Matte"_s})
+        EXPECT_EQ(PaperKindLetter(word), u"M"_s) << word.toStdString();
+    for (const QString& word : {u"מבריק"_s, u"GLOSSY"_s, u"Glossy"_s})
+        EXPECT_EQ(PaperKindLetter(word), u"G"_s) << word.toStdString();
+    for (const QString& word : {QString(), u"***"_s, u"M"_s})
         EXPECT_EQ(PaperKindLetter(word), QString()) << word.toStdString();
 }
 
 TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
     TestPlatform test;
-    const QString path = QStringLiteral("C:\\log.txt");
+    const QString path = u"C:\\log.txt"_s;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"Shemot.n1\",\"a, \"b\" c\"\r\n\"Shemot.TotalPics\",13\r\n"
                                       "\"Shemot.n3\",\"elsewhere\"\r\n\"Shemot.Hearot\",\"\"\r\nrubbish\r\n");
     OrderDetails details;
-    details.n2 = QStringLiteral("03");
-    details.n3 = QStringLiteral("street");
-    details.Hearot = QStringLiteral("old");
+    details.n2 = u"03"_s;
+    details.n3 = u"street"_s;
+    details.Hearot = u"old"_s;
     ReadOrderDetails(test.files, path, details);
-    EXPECT_EQ(details.n1, QStringLiteral("a, \"b\" c"));
-    EXPECT_EQ(details.n2, QStringLiteral("03"));
-    EXPECT_EQ(details.n3, QStringLiteral("street"));
+    EXPECT_EQ(details.n1, u"a, \"b\" c"_s);
+    EXPECT_EQ(details.n2, u"03"_s);
+    EXPECT_EQ(details.n3, u"street"_s);
     EXPECT_EQ(details.Hearot, QString());
     EXPECT_EQ(details.TotalPics, 13);
 }
 
 TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAgain) {
     TestPlatform test;
-    const QString path = QStringLiteral("C:\\log.txt");
+    const QString path = u"C:\\log.txt"_s;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
                                       "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
     OrderDetails details; // a new album has no customer, and the address may have been mended since
-    details.Mail = QStringLiteral("as corrected@example.com");
-    details.Bord = QStringLiteral("NB");
+    details.Mail = u"as corrected@example.com"_s;
+    details.Bord = u"NB"_s;
     ReadOrderDetails(test.files, path, details);
     EXPECT_EQ(details.n1, QString());
-    EXPECT_EQ(details.Mail, QStringLiteral("as corrected@example.com"));
+    EXPECT_EQ(details.Mail, u"as corrected@example.com"_s);
     EXPECT_EQ(details.TotalPics, 0);
     ReadResentDetails(test.files, path, details);
-    EXPECT_EQ(details.n1, QStringLiteral("Studio Or"));
-    EXPECT_EQ(details.ppr, QStringLiteral("30/60"));
-    EXPECT_EQ(details.Mail, QStringLiteral("studio@example.com"));
+    EXPECT_EQ(details.n1, u"Studio Or"_s);
+    EXPECT_EQ(details.ppr, u"30/60"_s);
+    EXPECT_EQ(details.Mail, u"studio@example.com"_s);
     EXPECT_EQ(details.Bord, QString()) << "of another order";
     EXPECT_EQ(details.TotalPics, 14);
 }
@@ -110,31 +112,30 @@ TEST(ReadOrderDetails, SaysSoWhenThereIsNoLog) {
     TestPlatform test;
     OrderDetails details;
     details.TotalPics = 4;
-    ReadOrderDetails(test.files, QStringLiteral("C:\\none.txt"), details);
+    ReadOrderDetails(test.files, u"C:\\none.txt"_s, details);
     for (const QString& text : {details.n1, details.n2, details.ppr, details.Hearot, details.Mail, details.FillFit,
                                 details.maat, details.Bord})
-        EXPECT_EQ(text, QStringLiteral("NO details"));
+        EXPECT_EQ(text, u"NO details"_s);
     EXPECT_EQ(details.TotalPics, 0);
 }
 
 TEST(CopiesCount, SumsTheFirstTwoCharactersOfAllButTexts) {
-    EXPECT_EQ(
-        CopiesCount({QStringLiteral("99order.txt"), QStringLiteral("!105_1234.jpp"), QStringLiteral("021015G.jpp"),
-                     QStringLiteral("1 1015G.jpp"), QStringLiteral("000.jpg"), QStringLiteral("ab.jpp")}),
-        3);
-    EXPECT_EQ(CopiesCount(QStringList(400, QStringLiteral("99.jpp"))), 32767);
+    EXPECT_EQ(CopiesCount({u"99order.txt"_s, u"!105_1234.jpp"_s, u"021015G.jpp"_s, u"1 1015G.jpp"_s, u"000.jpg"_s,
+                           u"ab.jpp"_s}),
+              3);
+    EXPECT_EQ(CopiesCount(QStringList(400, u"99.jpp"_s)), 32767);
 }
 
 TEST(OrderSummary, ShowsWhoOnlyForANewOrderAndDeliveryOnlyWhenAskedFor) {
     SessionState state = orderOfDana();
     const QDate date(2026, 11, 21);
     const QStringList plain = OrderSummaryLines(state, date);
-    EXPECT_EQ(plain, (QStringList{QStringLiteral("21/11/2026"),
-                                  QStringLiteral("Dana Levi"),
-                                  QStringLiteral("03-1234567"),
-                                  QStringLiteral("10/15NB מבריק"),
-                                  QStringLiteral("gift - "),
-                                  QStringLiteral(" סך תמונות 13"),
+    EXPECT_EQ(plain, (QStringList{u"21/11/2026"_s,
+                                  u"Dana Levi"_s,
+                                  u"03-1234567"_s,
+                                  u"10/15NB מבריק"_s,
+                                  u"gift - "_s,
+                                  u" סך תמונות 13"_s,
                                   {},
                                   {},
                                   {},
@@ -142,13 +143,13 @@ TEST(OrderSummary, ShowsWhoOnlyForANewOrderAndDeliveryOnlyWhenAskedFor) {
     state.transfer.SugMishloah = 1;
     state.MishloachHabaita = true;
     const QStringList resend = OrderSummaryLines(state, date);
-    EXPECT_FALSE(resend.contains(QStringLiteral("Dana Levi")));
-    EXPECT_EQ(resend.value(1), QStringLiteral(" משלוח חוזר "));
-    EXPECT_EQ(resend.value(4), QStringLiteral("  משלוח עד הבית  "));
+    EXPECT_FALSE(resend.contains(u"Dana Levi"_s));
+    EXPECT_EQ(resend.value(1), u" משלוח חוזר "_s);
+    EXPECT_EQ(resend.value(4), u"  משלוח עד הבית  "_s);
 }
 
 TEST(OrderSummary, IsDrawnDarkOnWhiteFromTheSideOfItsLanguage) {
-    const QStringList lines{QStringLiteral("IIIIIIII")};
+    const QStringList lines{u"IIIIIIII"_s};
     for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft}) {
         const Bitmap picture = OrderSummaryPicture(lines, direction);
         ASSERT_FALSE(picture.isNull());
@@ -175,30 +176,30 @@ TEST(UploadProgress, CountsFromNoneToAllAndCutsDown) {
 }
 
 TEST(UploadProgress, ReadsThePlaceOfAPieceFromItsName) {
-    const auto piece = PieceFromName(QStringLiteral("C:\\order\\a_002_008.prk"));
+    const auto piece = PieceFromName(u"C:\\order\\a_002_008.prk"_s);
     ASSERT_TRUE(piece);
-    EXPECT_EQ(piece->sequence, QStringLiteral("002"));
+    EXPECT_EQ(piece->sequence, u"002"_s);
     EXPECT_DOUBLE_EQ(piece->share(), 0.25);
     EXPECT_FALSE(piece->last());
-    EXPECT_TRUE(PieceFromName(QStringLiteral("a_008_008.prk"))->last());
-    EXPECT_DOUBLE_EQ(PieceFromName(QStringLiteral("a_001_000.prk"))->share(), 1);
-    EXPECT_FALSE(PieceFromName(QStringLiteral("a_001_000.jpp")));
+    EXPECT_TRUE(PieceFromName(u"a_008_008.prk"_s)->last());
+    EXPECT_DOUBLE_EQ(PieceFromName(u"a_001_000.prk"_s)->share(), 1);
+    EXPECT_FALSE(PieceFromName(u"a_001_000.jpp"_s));
     EXPECT_EQ(MinutesLeft(50, 7), 8);
 }
 
 TEST(BrokenFiles, ComeBackAsTheyWereWritten) {
     TestPlatform test;
     TextList broken;
-    broken.append(QStringLiteral("C:\\תמונות\\a.jpp"));
-    broken.append(QStringLiteral("C:\\b.jpp"));
-    ASSERT_TRUE(WriteBrokenFiles(test.files, QStringLiteral("C:"), broken));
-    EXPECT_EQ(ReadBrokenFiles(test.files, QStringLiteral("C:\\")), broken.items());
-    EXPECT_TRUE(IsBroken(broken, QStringLiteral("b.jpp")));
-    EXPECT_FALSE(IsBroken(broken, QStringLiteral("B.jpp")));
-    EXPECT_TRUE(ReadBrokenFiles(test.files, QStringLiteral("C:\\none")).isEmpty());
-    const auto written = WriteBrokenFiles(test.files, QStringLiteral("C:\\none"), broken);
+    broken.append(u"C:\\תמונות\\a.jpp"_s);
+    broken.append(u"C:\\b.jpp"_s);
+    ASSERT_TRUE(WriteBrokenFiles(test.files, u"C:"_s, broken));
+    EXPECT_EQ(ReadBrokenFiles(test.files, u"C:\\"_s), broken.items());
+    EXPECT_TRUE(IsBroken(broken, u"b.jpp"_s));
+    EXPECT_FALSE(IsBroken(broken, u"B.jpp"_s));
+    EXPECT_TRUE(ReadBrokenFiles(test.files, u"C:\\none"_s).isEmpty());
+    const auto written = WriteBrokenFiles(test.files, u"C:\\none"_s, broken);
     ASSERT_FALSE(written);
-    EXPECT_TRUE(written.failure().message.contains(QStringLiteral("kashloo.txt")));
+    EXPECT_TRUE(written.failure().message.contains(u"kashloo.txt"_s));
 }
 
 } // namespace lumora

@@ -12,6 +12,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 struct Screen {
     QSize size;
     bool english;
@@ -33,7 +35,7 @@ public:
 protected:
     void look(Walk& walk, const QString& name) {
         walk.settle(60);
-        walk.shot(QStringLiteral("%1-%2").arg(name, GetParam().english ? u"en" : u"he"));
+        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en" : u"he"));
         for (const QString& fault : walk.faults(GetParam().english))
             ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
     }

@@ -14,6 +14,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 namespace fs = std::filesystem;
 using DataChannel = Internet::DataChannel;
 
@@ -57,7 +59,7 @@ protected:
         EXPECT_TRUE(connection) << (connection ? "" : connection.failure().message.toStdString());
         if (!connection)
             return nullptr;
-        EXPECT_TRUE((*connection)->setCurrentDirectory(QStringLiteral("zalamim234")));
+        EXPECT_TRUE((*connection)->setCurrentDirectory(u"zalamim234"_s));
         return std::move(*connection);
     }
     static std::vector<std::string> names(const std::vector<FtpEntry>& entries) {
@@ -74,36 +76,36 @@ TEST_F(FtpTest, WalksMakesPutsListsGetsAndDeletes) {
         const QByteArray bytes = anyBytes(3'000'000);
         auto ftp = connect(lab.ftpHost(), channel);
         ASSERT_TRUE(ftp);
-        EXPECT_EQ(ftp->currentDirectory().value(), QStringLiteral("/zalamim234"));
-        const QString order = channel == DataChannel::Passive ? QStringLiteral("2026_11_21_KUP_1234^105")
-                                                              : QStringLiteral("2026_11_21_KUP_1234^106");
+        EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234"_s);
+        const QString order =
+            channel == DataChannel::Passive ? u"2026_11_21_KUP_1234^105"_s : u"2026_11_21_KUP_1234^106"_s;
         ASSERT_TRUE(ftp->makeDirectory(order));
         const auto again = ftp->makeDirectory(order);
         ASSERT_FALSE(again);
         EXPECT_EQ(again.failure().kind, Failure::Kind::Refused);
-        EXPECT_TRUE(again.failure().message.contains(QStringLiteral("550"))) << again.failure().message.toStdString();
+        EXPECT_TRUE(again.failure().message.contains(u"550"_s)) << again.failure().message.toStdString();
         ASSERT_TRUE(ftp->setCurrentDirectory(order));
-        EXPECT_TRUE(ftp->list(QStringLiteral("*.*"))->empty());
+        EXPECT_TRUE(ftp->list(u"*.*"_s)->empty());
 
-        const auto sent = ftp->put(file("a.jpp", bytes), QStringLiteral("a.jpp"));
+        const auto sent = ftp->put(file("a.jpp", bytes), u"a.jpp"_s);
         ASSERT_TRUE(sent) << sent.failure().message.toStdString();
-        ASSERT_TRUE(ftp->put(file("empty", QByteArray()), QStringLiteral("empty")));
+        ASSERT_TRUE(ftp->put(file("empty", QByteArray()), u"empty"_s));
         const HostPath there = lab.ordersFolder() / toHostPath(order);
         EXPECT_TRUE(contentOf(there / "a.jpp") == bytes);
         EXPECT_EQ(contentOf(there / "empty"), QByteArray());
-        EXPECT_EQ(names(*ftp->list(QStringLiteral("*.*"))), (std::vector<std::string>{"a.jpp", "empty"}));
+        EXPECT_EQ(names(*ftp->list(u"*.*"_s)), (std::vector<std::string>{"a.jpp", "empty"}));
 
         const HostPath back = toHostPath(local.path()) / "back";
-        ASSERT_TRUE(ftp->get(QStringLiteral("a.jpp"), back));
+        ASSERT_TRUE(ftp->get(u"a.jpp"_s, back));
         EXPECT_EQ(contentOf(back).size(), contentOf(there / "a.jpp").size());
-        ASSERT_TRUE(ftp->remove(QStringLiteral("a.jpp")));
+        ASSERT_TRUE(ftp->remove(u"a.jpp"_s));
         EXPECT_FALSE(fs::exists(there / "a.jpp"));
-        EXPECT_FALSE(ftp->remove(QStringLiteral("a.jpp")));
-        EXPECT_TRUE(ftp->lastResponse().startsWith(QStringLiteral("550")));
-        EXPECT_FALSE(ftp->get(QStringLiteral("a.jpp"), toHostPath(local.path()) / "never"));
+        EXPECT_FALSE(ftp->remove(u"a.jpp"_s));
+        EXPECT_TRUE(ftp->lastResponse().startsWith(u"550"_s));
+        EXPECT_FALSE(ftp->get(u"a.jpp"_s, toHostPath(local.path()) / "never"));
         EXPECT_FALSE(fs::exists(toHostPath(local.path()) / "never"));
-        EXPECT_TRUE(ftp->setCurrentDirectory(QStringLiteral("/")));
-        EXPECT_EQ(ftp->currentDirectory().value(), QStringLiteral("/"));
+        EXPECT_TRUE(ftp->setCurrentDirectory(u"/"_s));
+        EXPECT_EQ(ftp->currentDirectory().value(), u"/"_s);
     }
     EXPECT_FALSE(lab.ftpLog().contains("TYPE I"));
 }
@@ -111,13 +113,13 @@ TEST_F(FtpTest, WalksMakesPutsListsGetsAndDeletes) {
 TEST_F(FtpTest, SendsHebrewNamesAsBytesOfTheCodePageAndReadsThemBack) {
     auto ftp = connect(lab.ftpHost());
     ASSERT_TRUE(ftp);
-    const QString folder = QStringLiteral("הזמנה 7");
+    const QString folder = u"הזמנה 7"_s;
     ASSERT_TRUE(ftp->makeDirectory(folder));
     ASSERT_TRUE(ftp->setCurrentDirectory(folder));
-    EXPECT_EQ(ftp->currentDirectory().value(), QStringLiteral("/zalamim234/") + folder);
-    ASSERT_TRUE(ftp->put(file("x", "x"), QStringLiteral("שלום.txt")));
+    EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234/"_s + folder);
+    ASSERT_TRUE(ftp->put(file("x", "x"), u"שלום.txt"_s));
     EXPECT_TRUE(fs::exists(lab.ordersFolder() / "\xe4\xe6\xee\xf0\xe4 7" / "\xf9\xec\xe5\xed.txt"));
-    EXPECT_EQ(names(*ftp->list(QStringLiteral("*.*"))), (std::vector<std::string>{"שלום.txt"}));
+    EXPECT_EQ(names(*ftp->list(u"*.*"_s)), (std::vector<std::string>{"שלום.txt"}));
 }
 
 TEST_F(FtpTest, ListsOddNamesAsTheyAre) {
@@ -131,14 +133,14 @@ TEST_F(FtpTest, ListsOddNamesAsTheyAre) {
     fs::create_directory(lab.ordersFolder() / "sub folder");
     auto ftp = connect(lab.ftpHost());
     ASSERT_TRUE(ftp);
-    const auto entries = ftp->list(QStringLiteral("*.*"));
+    const auto entries = ftp->list(u"*.*"_s);
     ASSERT_TRUE(entries) << entries.failure().message.toStdString();
     std::vector<std::string> expected = odd;
     expected.push_back("sub folder");
     std::sort(expected.begin(), expected.end());
     EXPECT_EQ(names(*entries), expected);
     for (const FtpEntry& entry : *entries)
-        EXPECT_EQ(entry.folder, entry.name == QStringLiteral("sub folder")) << entry.name.toStdString();
+        EXPECT_EQ(entry.folder, entry.name == u"sub folder"_s) << entry.name.toStdString();
 }
 
 TEST_F(FtpTest, RefusesANameWithALineBreakBeforeAnythingIsSent) {
@@ -146,7 +148,7 @@ TEST_F(FtpTest, RefusesANameWithALineBreakBeforeAnythingIsSent) {
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
     const auto before = relay.commands();
-    for (const QString& name : {QStringLiteral("x\r\nMKD y"), QStringLiteral("x\ny"), QStringLiteral("a") + QChar(0)}) {
+    for (const QString& name : {u"x\r\nMKD y"_s, u"x\ny"_s, u"a"_s + QChar(0)}) {
         EXPECT_FALSE(ftp->makeDirectory(name));
         EXPECT_FALSE(ftp->put(file("x", "x"), name));
         EXPECT_FALSE(ftp->list(name));
@@ -156,16 +158,15 @@ TEST_F(FtpTest, RefusesANameWithALineBreakBeforeAnythingIsSent) {
 }
 
 TEST_F(FtpTest, TellsARefusedLoginInTheServersWordsAndNeverThePassword) {
-    const auto refused =
-        internet.connectFtp(lab.ftpHost(), LabServers::user(), QStringLiteral("wr0ng-pass"), DataChannel::Passive);
+    const auto refused = internet.connectFtp(lab.ftpHost(), LabServers::user(), u"wr0ng-pass"_s, DataChannel::Passive);
     ASSERT_FALSE(refused);
     EXPECT_EQ(refused.failure().kind, Failure::Kind::Refused);
-    EXPECT_TRUE(refused.failure().message.contains(QStringLiteral("530"))) << refused.failure().message.toStdString();
-    EXPECT_FALSE(refused.failure().message.contains(QStringLiteral("wr0ng")));
+    EXPECT_TRUE(refused.failure().message.contains(u"530"_s)) << refused.failure().message.toStdString();
+    EXPECT_FALSE(refused.failure().message.contains(u"wr0ng"_s));
 }
 
 TEST_F(FtpTest, FailsAtOnceWhereNobodyListensAndWithinTheLimitWhereNobodyAnswers) {
-    const auto closed = internet.connectFtp(QStringLiteral("127.0.0.1:%1").arg(FreePort()), LabServers::user(),
+    const auto closed = internet.connectFtp(u"127.0.0.1:%1"_s.arg(FreePort()), LabServers::user(),
                                             LabServers::password(), DataChannel::Passive);
     ASSERT_FALSE(closed);
     EXPECT_EQ(closed.failure().kind, Failure::Kind::Disconnected);
@@ -182,8 +183,8 @@ TEST_F(FtpTest, FallsBackToPasvWhereEpsvIsRefused) {
     relay.setFaults({.command = "EPSV", .reply = "500 Unknown command"});
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
-    ASSERT_TRUE(ftp->put(file("x", "x"), QStringLiteral("x.jpp")));
-    EXPECT_TRUE(ftp->list(QStringLiteral("*.*")));
+    ASSERT_TRUE(ftp->put(file("x", "x"), u"x.jpp"_s));
+    EXPECT_TRUE(ftp->list(u"*.*"_s));
     EXPECT_EQ(relay.commands().count("EPSV"), 1);
     EXPECT_EQ(relay.commands().count("PASV"), 2);
 }
@@ -214,7 +215,7 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         const QByteArray bytes = anyBytes(each.bytes);
         QElapsedTimer waiting;
         waiting.start();
-        const QString name = QString::fromLatin1(each.name) + QStringLiteral(".jpp");
+        const QString name = QString::fromLatin1(each.name) + u".jpp"_s;
         const auto sent = ftp->put(file("x", bytes), name);
         EXPECT_FALSE(sent);
         EXPECT_EQ(relay.faultsMade(), 1);
@@ -225,7 +226,7 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
 
         ftp = connect(relay.host());
         ASSERT_TRUE(ftp);
-        const QString second = QStringLiteral("2") + name;
+        const QString second = u"2"_s + name;
         ASSERT_TRUE(ftp->put(file("x", bytes), second));
         EXPECT_TRUE(contentOf(lab.ordersFolder() / toHostPath(second)) == bytes);
     }
@@ -236,7 +237,7 @@ TEST_F(FtpTest, TakesAReplyThatComesLateAndAConnectionThatIsRefusedOnce) {
     relay.setFaults({.delayReplies = std::chrono::milliseconds(100)});
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
-    EXPECT_TRUE(ftp->put(file("x", "x"), QStringLiteral("late.jpp")));
+    EXPECT_TRUE(ftp->put(file("x", "x"), u"late.jpp"_s));
     relay.setFaults({.refuseConnections = true, .times = 1});
     EXPECT_FALSE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
     EXPECT_TRUE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
@@ -245,10 +246,10 @@ TEST_F(FtpTest, TakesAReplyThatComesLateAndAConnectionThatIsRefusedOnce) {
 TEST_F(FtpTest, MissesALocalFileBeforeItAsksTheServer) {
     auto ftp = connect(lab.ftpHost());
     ASSERT_TRUE(ftp);
-    const auto missing = ftp->put(toHostPath(local.path()) / "no.jpp", QStringLiteral("no.jpp"));
+    const auto missing = ftp->put(toHostPath(local.path()) / "no.jpp", u"no.jpp"_s);
     ASSERT_FALSE(missing);
     EXPECT_EQ(missing.failure().kind, Failure::Kind::NotFound);
-    EXPECT_TRUE(ftp->list(QStringLiteral("*.*"))->empty());
+    EXPECT_TRUE(ftp->list(u"*.*"_s)->empty());
 }
 
 TEST(SecondKindOfFtpServer, TakesTheSameCalls) {
@@ -260,23 +261,23 @@ TEST(SecondKindOfFtpServer, TakesTheSameCalls) {
                                       DataChannel::Passive);
     ASSERT_TRUE(opened) << opened.failure().message.toStdString();
     FtpConnection& ftp = **opened;
-    EXPECT_EQ(ftp.currentDirectory().value(), QStringLiteral("/"));
-    ASSERT_TRUE(ftp.makeDirectory(QStringLiteral("zalamim234")));
-    ASSERT_TRUE(ftp.setCurrentDirectory(QStringLiteral("zalamim234")));
-    EXPECT_TRUE(ftp.list(QStringLiteral("*.*"))->empty());
+    EXPECT_EQ(ftp.currentDirectory().value(), u"/"_s);
+    ASSERT_TRUE(ftp.makeDirectory(u"zalamim234"_s));
+    ASSERT_TRUE(ftp.setCurrentDirectory(u"zalamim234"_s));
+    EXPECT_TRUE(ftp.list(u"*.*"_s)->empty());
     // This kind turns CR LF into LF on arrival, so only bytes without a line end of two are compared.
     QByteArray bytes = anyBytes(2'000'000);
     bytes.replace('\r', 'r');
     const HostPath source = toHostPath(local.path()) / "a";
     std::ofstream(source, std::ios::binary).write(bytes.constData(), bytes.size());
-    const auto sent = ftp.put(source, QStringLiteral("no  ending"));
+    const auto sent = ftp.put(source, u"no  ending"_s);
     ASSERT_TRUE(sent) << sent.failure().message.toStdString();
     EXPECT_TRUE(contentOf(server.account() / "zalamim234" / "no  ending") == bytes);
-    const auto entries = ftp.list(QStringLiteral("*.*"));
+    const auto entries = ftp.list(u"*.*"_s);
     ASSERT_EQ(entries->size(), 1U);
-    EXPECT_EQ(entries->front().name, QStringLiteral("no  ending"));
-    EXPECT_FALSE(ftp.remove(QStringLiteral("missing")));
-    EXPECT_TRUE(ftp.remove(QStringLiteral("no  ending")));
+    EXPECT_EQ(entries->front().name, u"no  ending"_s);
+    EXPECT_FALSE(ftp.remove(u"missing"_s));
+    EXPECT_TRUE(ftp.remove(u"no  ending"_s));
 }
 
 } // namespace

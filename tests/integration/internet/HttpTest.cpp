@@ -13,6 +13,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 class HttpTest : public ::testing::Test {
 protected:
     QTemporaryDir local;
@@ -24,9 +26,8 @@ protected:
 };
 
 TEST_F(HttpTest, SendsTheAddressAsItStands) {
-    const QString script = lab.site() + QStringLiteral("/aaaqamootreport/padd.asp");
-    const auto answer =
-        internet.fetch(script + QStringLiteral("?k1=tarvelmond&t1=a b&t3=Pratim: דנה\r\nלוי&t5=50%&t2=x#y+\"z\""));
+    const QString script = lab.site() + u"/aaaqamootreport/padd.asp"_s;
+    const auto answer = internet.fetch(script + u"?k1=tarvelmond&t1=a b&t3=Pratim: דנה\r\nלוי&t5=50%&t2=x#y+\"z\""_s);
     ASSERT_TRUE(answer) << answer.failure().message.toStdString();
     EXPECT_EQ(*answer, QByteArray("OK\r\n"));
     EXPECT_EQ(lab.requests(1).value(0), QByteArray("GET /aaaqamootreport/padd.asp?k1=tarvelmond&t1=a%20b&t3=Pratim:%20"
@@ -35,7 +36,7 @@ TEST_F(HttpTest, SendsTheAddressAsItStands) {
 }
 
 TEST_F(HttpTest, GivesTheBodyWhateverTheStatusButDownloadsOnlyAGoodAnswer) {
-    const QString absent = lab.site() + QStringLiteral("/aaaqamootreport/padd.aspc.txt");
+    const QString absent = lab.site() + u"/aaaqamootreport/padd.aspc.txt"_s;
     const auto page = internet.fetch(absent);
     ASSERT_TRUE(page);
     EXPECT_TRUE(page->contains("404"));
@@ -43,7 +44,7 @@ TEST_F(HttpTest, GivesTheBodyWhateverTheStatusButDownloadsOnlyAGoodAnswer) {
     ASSERT_FALSE(refused);
     EXPECT_EQ(refused.failure().kind, Failure::Kind::Refused);
     EXPECT_FALSE(std::filesystem::exists(target));
-    ASSERT_TRUE(internet.download(lab.site() + QStringLiteral("/aaasssppp/p.asp?t1=x&t2=true"), target));
+    ASSERT_TRUE(internet.download(lab.site() + u"/aaasssppp/p.asp?t1=x&t2=true"_s, target));
     QFile file(toText(target));
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));
     EXPECT_EQ(file.readAll(), QByteArray("OK\r\n"));
@@ -51,11 +52,11 @@ TEST_F(HttpTest, GivesTheBodyWhateverTheStatusButDownloadsOnlyAGoodAnswer) {
 
 TEST_F(HttpTest, FailsClearlyWhereThereIsNoAnswer) {
     const std::pair<QString, Failure::Kind> cases[] = {
-        {QStringLiteral("https://127.0.0.1/x"), Failure::Kind::Unsupported},
-        {QStringLiteral("ftp://127.0.0.1/x"), Failure::Kind::Unsupported},
-        {QStringLiteral("http:///x"), Failure::Kind::Unsupported},
+        {u"https://127.0.0.1/x"_s, Failure::Kind::Unsupported},
+        {u"ftp://127.0.0.1/x"_s, Failure::Kind::Unsupported},
+        {u"http:///x"_s, Failure::Kind::Unsupported},
         {QString(), Failure::Kind::Unsupported},
-        {QStringLiteral("http://127.0.0.1:%1/x").arg(FreePort()), Failure::Kind::Disconnected},
+        {u"http://127.0.0.1:%1/x"_s.arg(FreePort()), Failure::Kind::Disconnected},
     };
     for (const auto& [url, kind] : cases) {
         const auto answer = internet.fetch(url);
@@ -66,7 +67,7 @@ TEST_F(HttpTest, FailsClearlyWhereThereIsNoAnswer) {
 
 TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatWasCutOrStoodStill) {
     TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
-    const QString url = QStringLiteral("http://%1/nothing").arg(relay.host());
+    const QString url = u"http://%1/nothing"_s.arg(relay.host());
     relay.setFaults({.cutDataAfter = 40, .times = 1});
     EXPECT_FALSE(internet.download(url, target));
     relay.setFaults({.stallDataAfter = 40, .times = 1});
@@ -85,7 +86,7 @@ TEST_F(HttpTest, LetsQueuedPaintingRunButNoTimerWhileItWaits) {
     QMetaObject::invokeMethod(
         &page, [&] { painted = true; }, Qt::QueuedConnection);
     QTimer::singleShot(50, &page, [&] { ticked = true; });
-    EXPECT_FALSE(internet.fetch(QStringLiteral("http://%1/x").arg(relay.host())));
+    EXPECT_FALSE(internet.fetch(u"http://%1/x"_s.arg(relay.host())));
     EXPECT_TRUE(painted);
     EXPECT_FALSE(ticked);
 }

@@ -16,13 +16,15 @@
 // A prepared order, the sending page, a real FTP server behind a bad line, and a real web server.
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-const QString uploaded = QStringLiteral("הקבצים הועלו בהצלחה");
-const QString notAll = QStringLiteral("לא כל הקבצים הועלו");
-const QString second = QStringLiteral("נסיון שני לקבצים שלא עלו");
-const QString third = QStringLiteral("נסיון שלישי לקבצים שלא עלו");
-const QString fourth = QStringLiteral("נסיון רביעי ואחרון להעלות קבצים שלא עלו");
+const QString uploaded = u"הקבצים הועלו בהצלחה"_s;
+const QString notAll = u"לא כל הקבצים הועלו"_s;
+const QString second = u"נסיון שני לקבצים שלא עלו"_s;
+const QString third = u"נסיון שלישי לקבצים שלא עלו"_s;
+const QString fourth = u"נסיון רביעי ואחרון להעלות קבצים שלא עלו"_s;
 
 // Larger than any other file of the order, so that a cut by length strikes it alone.
 constexpr int largeSize = 300000;
@@ -36,8 +38,8 @@ protected:
         profile.FtpServer = relay.host();
         profile.FtpUser = LabServers::user();
         profile.FtpPassword = LabServers::password();
-        profile.ReportUrl = lab.site() + QStringLiteral("/aaaqamootreport/padd.asp");
-        profile.DoneUrl = lab.site() + QStringLiteral("/aaasssppp/p.asp");
+        profile.ReportUrl = lab.site() + u"/aaaqamootreport/padd.asp"_s;
+        profile.DoneUrl = lab.site() + u"/aaasssppp/p.asp"_s;
         // Every value of a byte and line ends of each kind.
         QByteArray large;
         for (int i = 0; i < largeSize; ++i)
@@ -57,7 +59,7 @@ protected:
     // What the customer's side must keep: the order without the page's own list and the summary's picture.
     std::map<QString, QByteArray> localOrder() const {
         auto files = rig.localFiles();
-        files.erase(QStringLiteral("kashloo.txt"));
+        files.erase(u"kashloo.txt"_s);
         files.erase(FtpFrmRig::proof());
         return files;
     }
@@ -84,7 +86,7 @@ protected:
 
     // The names of the puts that reached the server, by its own log.
     QStringList puts() const {
-        static const QRegularExpression put(QStringLiteral("FTP command: .*\"STOR (.*)\""));
+        static const QRegularExpression put(u"FTP command: .*\"STOR (.*)\""_s);
         QStringList names;
         auto matches = put.globalMatch(QString::fromLatin1(lab.ftpLog()));
         while (matches.hasNext())
@@ -164,7 +166,7 @@ LineFault faultOf(const char* name, const TcpRelay::Faults& faults, bool success
 
 LineFault wrongPassword() {
     LineFault fault = faultOf("login_refused", {}, false, fourth, 0, FtpFrmRig::names());
-    fault.password = QStringLiteral("wrong");
+    fault.password = u"wrong"_s;
     return fault;
 }
 
@@ -187,12 +189,11 @@ TEST_F(SendToLab, AnOrderArrivesByteForByteAndTheLabsSiteIsTold) {
     expectArrived();
     EXPECT_TRUE(localOrder() == before);
     EXPECT_EQ(lab.requests(3),
-              (QByteArrayList{
-                  requestLine(QStringLiteral("/aaaqamootreport/padd.aspc.txt")),
-                  requestLine(QStringLiteral("/aaaqamootreport/padd.asp?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    "
-                                             "10_15G_FIT_NB&t2=Notes: gift, \"big\" - &t3=Pratim: 03-1234567    דנה "
-                                             "לוי&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13")),
-                  requestLine(QStringLiteral("/aaasssppp/p.asp?t1=tarvelmond&t2=true"))}));
+              (QByteArrayList{requestLine(u"/aaaqamootreport/padd.aspc.txt"_s),
+                              requestLine(u"/aaaqamootreport/padd.asp?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    "
+                                          "10_15G_FIT_NB&t2=Notes: gift, \"big\" - &t3=Pratim: 03-1234567    דנה "
+                                          "לוי&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"_s),
+                              requestLine(u"/aaasssppp/p.asp?t1=tarvelmond&t2=true"_s)}));
 }
 
 TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) {
