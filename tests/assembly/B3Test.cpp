@@ -224,16 +224,6 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
     }
 }
 
-TEST_F(PreparingAnEditedOrder, saysSoWhenThereIsNothingToPrepare) {
-    B3& page = open({});
-    page.Timer2_Tick();
-    EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
-    EXPECT_FALSE(machine.files.folderExists(folder()));
-    EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_s));
-    EXPECT_FALSE(page.preparing);
-    EXPECT_TRUE(page.Command5.enabled && page.Command5.visible);
-}
-
 TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPreparesAndCountsAfterThePictures) {
     B3& page = open({edited(givePicture(u"one_1.jpg"_s)), edited(givePicture(u"two_2.jpg"_s))});
     bool countedEarly = false;
@@ -311,22 +301,6 @@ TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
     EXPECT_EQ(made.size() + failed.size(), pictures) << "each picture is printed or named as failed";
     for (const QString& name : made)
         EXPECT_TRUE(unpacked(name)) << name.toStdString();
-}
-
-TEST_F(PreparingAnEditedOrder, saysItsTextsInTheLanguageOfTheSession) {
-    B3& page = open({edited(givePicture(u"one_1.jpg"_s))});
-    EXPECT_EQ(page.Label4Title.text, u"הכנת תמונות למשלוח"_s);
-    EXPECT_TRUE(page.Command7.visible && !page.Command2.visible);
-    state.EnglishTips = 1;
-    page.setTexts();
-    EXPECT_EQ(page.Command2.text, u" Stop All and EXIT"_s);
-    for (const Caption* caption :
-         {&page.Label4Title, &page.Label4Progress, &page.Label4fail, &page.Label1, &page.Label2, &page.Command1,
-          &page.Command2, &page.Command5, &page.Command7, &page.Picture5}) {
-        EXPECT_FALSE(caption->text.isEmpty());
-        for (const QChar letter : caption->text)
-            EXPECT_NE(letter.script(), QChar::Script_Hebrew) << caption->text.toStdString();
-    }
 }
 
 } // namespace

@@ -1,6 +1,6 @@
 #include "assembly/OrderSheet.h"
 
-#include "session/SessionState.h"
+#include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
 
 #include <QPainter>
@@ -16,26 +16,15 @@ QStringList linesOf(SessionState& state) {
     return plainSheetLines(state, FixedClock().now());
 }
 
-SessionState sessionOfTheExample() {
-    SessionState state;
-    state.shemot.n1 = u"Dana Levi"_s;
-    state.shemot.n2 = u"03-1234567"_s;
+SessionState deliveredOrder() {
+    SessionState state = exampleOrder();
     state.shemot.n3 = u"Herzl 1"_s;
-    state.shemot.ppr = u"10/15"_s;
     state.shemot.maat = u"Matte"_s;
-    state.shemot.FillFit = u"FIT"_s;
-    state.shemot.Bord = u"NB"_s;
-    state.shemot.Mail = u"dana@example.com"_s;
-    state.shemot.Hearot = u"gift - "_s;
-    state.shemot.Girsa = u"4.00"_s;
-    state.shemot.TotalPics = 13;
-    state.MisparHazmana = u"105"_s;
-    state.shemot.ser = u"1234"_s;
     return state;
 }
 
 TEST(OrderSheet, tellsTheOrderInSixLines) {
-    SessionState state = sessionOfTheExample();
+    SessionState state = deliveredOrder();
     EXPECT_EQ(linesOf(state), QStringList({
                                   u"No.....105_1234    21/11/2026 14:05:09      ver: 4.00"_s,
                                   u"  Name....Dana Levi        Tel.....03-1234567      "_s,
@@ -56,7 +45,7 @@ TEST(OrderSheet, tellsTheOrderInSixLines) {
 }
 
 TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
-    SessionState state = sessionOfTheExample();
+    SessionState state = deliveredOrder();
     state.KodMishloach = u"HOM"_s;
     const QStringList wanted = {
         u"No.....105_1234    21/11/2026 14:05:09     קבלת תמונות בדואר  ver: 4.00"_s,
@@ -72,7 +61,7 @@ TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
 }
 
 TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
-    SessionState state = sessionOfTheExample();
+    SessionState state = deliveredOrder();
     AlbumDetails& album = state.album;
     album.ShemZalam = u"Studio Or"_s;
     album.TelZalam = u"03-7654321"_s;
@@ -187,7 +176,7 @@ TEST_F(ContactSheet, endsWithItsLastCellAndWhereItIsToldTo) {
 }
 
 TEST_F(ContactSheet, writesTheLinesAboveThePictures) {
-    SessionState state = sessionOfTheExample();
+    SessionState state = deliveredOrder();
     OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
     const QImage empty = sheet.bitmap().image();
     sheet.drawLines(linesOf(state));

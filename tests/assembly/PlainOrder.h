@@ -4,7 +4,7 @@
 #include "assembly/PrintFile.h"
 #include "imaging/PictureFile.h"
 #include "session/PageChain.h"
-#include "session/SessionState.h"
+#include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -34,23 +34,13 @@ inline Bitmap noisyPicture(int width, int height, unsigned seed) {
 class PreparingAPlainOrder : public ::testing::Test {
 protected:
     PreparingAPlainOrder()
-        : chain(machine.pump) {
+        : state(exampleOrder())
+        , chain(machine.pump) {
         state.DiskRoot = machine.drives.programRoot();
         state.Optint = 1;
-        state.MisparHazmana = u"105"_s;
+        state.shemot.TotalPics = 0;
         state.profile.JppBase = 30;
         state.profile.JppChunks = 56;
-        state.shemot.n1 = u"Dana Levi"_s;
-        state.shemot.n2 = u"03-1234567"_s;
-        state.shemot.Mail = u"dana@example.com"_s;
-        state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
-        state.shemot.Hearot = u"gift - "_s;
-        state.shemot.ppr = u"10/15"_s;
-        state.shemot.Bord = u"NB"_s;
-        state.shemot.maat = u"מבריק"_s;
-        state.shemot.FillFit = u"FIT"_s;
-        state.shemot.ser = u"1234"_s;
-        state.shemot.Girsa = u"4.00"_s;
         state.transfer.SugMishloah = 1;
         for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
             chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });

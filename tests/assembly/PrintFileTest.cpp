@@ -2,7 +2,7 @@
 
 #include "assembly/OrderTail.h"
 #include "assembly/PrintFileName.h"
-#include "session/SessionState.h"
+#include "support/ExampleOrder.h"
 
 #include <gtest/gtest.h>
 
@@ -10,16 +10,6 @@ namespace lumora {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-SessionState sessionOfTheExample() {
-    SessionState state;
-    state.shemot.n1 = u"Dana Levi"_s;
-    state.shemot.n2 = u"03-1234567"_s;
-    state.shemot.TotalPics = 13;
-    state.MisparHazmana = u"105"_s;
-    state.shemot.ser = u"1234"_s;
-    return state;
-}
 
 QByteArray someBytes(int count) {
     QByteArray bytes;
@@ -29,7 +19,7 @@ QByteArray someBytes(int count) {
 }
 
 TEST(PrintFile, isWrittenAsTheLabsToolsReadIt) {
-    const QByteArray tail = OrderTail::of(sessionOfTheExample()).shortForm();
+    const QByteArray tail = OrderTail::of(exampleOrder()).shortForm();
     const Result<QByteArray> file = packPrintFile("ABCDEFGHIJKLMN", {4, 30}, tail);
     ASSERT_TRUE(file);
     EXPECT_EQ(file->toHex().toUpper(),
@@ -101,7 +91,7 @@ TEST(PrintFile, refusesWhatDoesNotHoldTogether) {
 }
 
 TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
-    SessionState state = sessionOfTheExample();
+    SessionState state = exampleOrder();
     state.shemot.n1 = QString::fromUtf8("דנה לוי-כהן\U0001F600");
     state.shemot.n2 = u"+972-3-1234567"_s;
     state.shemot.TotalPics = 1234;
@@ -121,7 +111,7 @@ TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
 }
 
 TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {
-    const OrderTail tail = OrderTail::of(sessionOfTheExample());
+    const OrderTail tail = OrderTail::of(exampleOrder());
     const QString name = u"a very long name of 30 letters"_s;
     EXPECT_EQ(tail.form(40, name), tail.shortForm());
     EXPECT_EQ(tail.form(60, name), tail.shortForm() + "^ name of 30 letters");

@@ -1,7 +1,10 @@
 #include "editing/EditRecord.h"
+#include "common/FixedText.h"
 #include "session/SessionState.h"
 
 #include <gtest/gtest.h>
+
+#include <array>
 
 namespace lumora {
 namespace {
@@ -52,15 +55,32 @@ TEST(EditRecord, CutsWhatIsTooLongForItsField) {
     EXPECT_EQ(edit.TextFontSize, 8);
 }
 
-TEST(EditRecord, OfANewPictureThatWasOpenedHoldsTheCentreAndEveryField) {
-    EditFields edit;
-    UnpackEditState(EditRecord::newPicture(), edit);
-    edit.PanX = 225;
-    edit.PanY = 150;
-    PackEditState(edit, u"NB"_s, u"blue"_s);
-    const QString start = u"1   1   1   180100225 150 0  0  000000000000"_s + QString(10, u' ') +
-                          u"8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "_s;
-    EXPECT_EQ(edit.EditState.toStdString(), start.leftJustified(EditRecord::width).toStdString());
+TEST(EditRecord, UnpacksByPositionAndReadsBlanksAsTheirDefaults) {
+    EditFields fields;
+    fields.PicturePath = u"C:\\pics\\תמונה.jpg"_s;
+    UnpackEditState(EditRecord::newPicture(), fields);
+    EXPECT_EQ(fields.GainB, 1.0F);
+    EXPECT_EQ(fields.RotationCode, 180);
+    EXPECT_EQ(fields.PanY, 999);
+    EXPECT_EQ(fields.AutoMarker, u"000");
+    EXPECT_EQ(fields.TextFontSize, 8);
+    EXPECT_EQ(fields.EditState.size(), 200);
+    EXPECT_EQ(fields.PicturePath, u"C:\\pics\\תמונה.jpg");
+
+    // One character of its own at the start of each field shows that no column is shifted.
+    const QString record = u"1.290.5 0.02170210-99 12  1  2  034R11RED111kids      242 7 8 1 ddd       "_s +
+                           u"2551281  45 60 9  3 2 "_s + LeftField(u"David"_s, 30) + LeftField(u"שלום  עולם"_s, 74);
+    UnpackEditState(record, fields);
+    EXPECT_FLOAT_EQ(fields.GainB, 0.02F);
+    EXPECT_EQ(fields.ZoomPercent, 210);
+    EXPECT_EQ(fields.FrameFolder, u"kids");
+    EXPECT_EQ((std::array{fields.TextRed, fields.TextGreen, fields.TextBlue}),
+              (std::array<std::int16_t, 3>{1, 128, 255}));
+    EXPECT_EQ(fields.TextX, 45);
+    EXPECT_EQ(fields.TextFont, u"David");
+    EXPECT_EQ(fields.TextBody, u"שלום  עולם");
+    PackEditState(fields, u"NB"_s, {});
+    EXPECT_EQ(fields.EditState.toStdString(), record.toStdString());
 }
 
 TEST(EditRecord, CarriesTheOrdersBorderAsAFrame) {
@@ -77,18 +97,6 @@ TEST(EditRecord, CarriesTheOrdersBorderAsAFrame) {
         EXPECT_EQ(edit.FrameName.toStdString(), expected.frameAfter);
         EXPECT_EQ(edit.FrameFolder.toStdString(), expected.folderAfter);
     }
-}
-
-TEST(EditStep, HoldsTheRangesOfEachButton) {
-    EXPECT_EQ(EditStep::zoom(210, 2), 210);
-    EXPECT_EQ(EditStep::zoom(40, -2), 40);
-    EXPECT_EQ(EditStep::turn(540, 1), 180);
-    EXPECT_EQ(EditStep::turn(180, -1), 179);
-    EXPECT_EQ(EditStep::turn(-32768, -1), -32768);
-    EXPECT_EQ(EditStep::quarterRight(500), 230);
-    EXPECT_EQ(EditStep::quarterRight(450), 540);
-    EXPECT_EQ(EditStep::quarterLeft(230), 500);
-    EXPECT_EQ(EditStep::quarterLeft(270), 180);
 }
 
 } // namespace

@@ -1,60 +1,25 @@
-#include "editing/mikledet.h"
-
-#include "editing/BigPics.h"
-#include "editing/EditRecord.h"
-#include "editing/tFrmNew.h"
-#include "imaging/PictureFile.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "session/Workspace.h"
-#include "support/TestPlatform.h"
-
-#include <gtest/gtest.h>
-
-#include <functional>
+#include "TheEditor.h"
 
 namespace lumora {
 namespace {
 
 using namespace Qt::StringLiterals;
 
-class CaptionKeys : public ::testing::Test {
+// The caption's keyboard over a picture that is open in the editor.
+class CaptionKeys : public TheEditor {
 protected:
-    CaptionKeys()
-        : chain(machine.pump) {
-        state.DiskRoot = machine.drives.programRoot();
-        state.shemot.ppr = u"10/15"_s;
-        state.shemot.Bord = u"NB"_s;
-        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
-        const QString picture = u"C:\\picture.jpg"_s;
-        EXPECT_TRUE(saveJpeg(Bitmap(400, 300, Qt::gray), *machine.drives.toHost(picture), 95));
-        chain.registerPage(PageId::tFrmNew,
-                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
-        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
-        chain.registerPage(PageId::mikledet,
-                           [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
-        auto& editor = static_cast<tFrmNew&>(chain.load(PageId::tFrmNew));
-        QObject::connect(&editor, &tFrmNew::stored, &editor, [this] { ++stores; });
-        UnpackEditState(EditRecord::newPicture(), state.edit);
-        state.edit.PicturePath = picture;
-        chain.show(PageId::tFrmNew);
-        editor.Command17_Click();
-        editor.Command8_Click();
-        stores = 0;
+    CaptionKeys() {
+        open(lying).Command8_Click();
+        stored.clear();
     }
 
     mikledet& page() { return static_cast<mikledet&>(chain.load(PageId::mikledet)); }
     // What the stored record gives back.
-    EditFields stored() const {
+    EditFields kept() const {
         EditFields fields;
         UnpackEditState(state.edit.EditState, fields);
         return fields;
     }
-
-    TestPlatform machine;
-    SessionState state;
-    PageChain chain;
-    int stores = 0;
 };
 
 TEST_F(CaptionKeys, theSixtyFirstLetterIsRefusedWhileSpaceAndEnterGoOn) {
@@ -63,7 +28,7 @@ TEST_F(CaptionKeys, theSixtyFirstLetterIsRefusedWhileSpaceAndEnterGoOn) {
     EXPECT_TRUE(machine.dialogs.messages.isEmpty());
     page().leter_Click(12);
     EXPECT_EQ(machine.dialogs.messages, QStringList{u"עד  60  אותיות"_s});
-    EXPECT_EQ(stores, 60);
+    EXPECT_EQ(stored.size(), 60);
     page().Command1_Click();
     page().Command7_Click();
     EXPECT_EQ(page().Text1.text, QString(60, u'ש') + u" \r\n"_s);
@@ -71,7 +36,7 @@ TEST_F(CaptionKeys, theSixtyFirstLetterIsRefusedWhileSpaceAndEnterGoOn) {
     state.EnglishTips = 1;
     page().KeyPress(u'x');
     EXPECT_EQ(machine.dialogs.messages.last(), u"Up to 60 letters"_s);
-    EXPECT_EQ(stored().TextBody.size(), 63) << "the record has room for 70";
+    EXPECT_EQ(kept().TextBody.size(), 63) << "the record has room for 70";
 }
 
 TEST_F(CaptionKeys, aBlankReachesThePictureWithTheNextKey) {
@@ -79,28 +44,28 @@ TEST_F(CaptionKeys, aBlankReachesThePictureWithTheNextKey) {
     page().Command1_Click();
     EXPECT_EQ(page().Text1.text, u"א "_s);
     EXPECT_EQ(state.edit.TextBody, u"א"_s);
-    EXPECT_EQ(stores, 1);
+    EXPECT_EQ(stored.size(), 1);
     page().leter_Click(19);
-    EXPECT_EQ(stored().TextBody, u"א ב"_s);
+    EXPECT_EQ(kept().TextBody, u"א ב"_s);
     // A key without a letter types a blank as a letter.
     page().leter_Click(11);
     EXPECT_EQ(state.edit.TextBody, u"א ב "_s);
-    EXPECT_EQ(stores, 3);
+    EXPECT_EQ(stored.size(), 3);
 }
 
 TEST_F(CaptionKeys, takesBackOneCharacterAndClearsAll) {
     page().Command3_Click();
-    EXPECT_EQ(stores, 0) << "nothing to take back";
+    EXPECT_EQ(stored.size(), 0) << "nothing to take back";
     page().leter_Click(7);
     page().leter_Click(19);
     page().Command3_Click();
-    EXPECT_EQ(stored().TextBody, u"א"_s);
+    EXPECT_EQ(kept().TextBody, u"א"_s);
     page().Command5_Click();
     EXPECT_TRUE(page().Frame1.visible);
     page().Command6_Click();
     EXPECT_FALSE(page().Frame1.visible);
     EXPECT_TRUE(page().Text1.text.isEmpty());
-    EXPECT_TRUE(stored().TextBody.isEmpty());
+    EXPECT_TRUE(kept().TextBody.isEmpty());
     page().Command5_Click();
     page().leter_Click(KeyLayout::firstSymbol);
     EXPECT_FALSE(page().Frame1.visible);
@@ -122,11 +87,11 @@ TEST_F(CaptionKeys, removingTheTextKeepsItForLater) {
     page().leter_Click(7);
     page().Command8_Click();
     EXPECT_FALSE(page().Check4.checked);
-    EXPECT_EQ(stored().TextOn, 0);
-    EXPECT_EQ(stored().TextBody, u"א"_s);
+    EXPECT_EQ(kept().TextOn, 0);
+    EXPECT_EQ(kept().TextBody, u"א"_s);
     page().Check4_Click(true);
-    EXPECT_EQ(stored().TextOn, 1);
-    EXPECT_EQ(stored().TextBody, u"א"_s);
+    EXPECT_EQ(kept().TextOn, 1);
+    EXPECT_EQ(kept().TextBody, u"א"_s);
 }
 
 TEST_F(CaptionKeys, sizeAndPlaceStepByTwoForEachTick) {
@@ -148,21 +113,21 @@ TEST_F(CaptionKeys, sizeAndPlaceStepByTwoForEachTick) {
         page().Image15_MouseDown(given.direction);
         page().tickOnceIfNone();
         page().Image15_MouseUp();
-        EXPECT_EQ(stored().TextX, given.x);
-        EXPECT_EQ(stored().TextY, given.y);
+        EXPECT_EQ(kept().TextX, given.x);
+        EXPECT_EQ(kept().TextY, given.y);
     }
-    EXPECT_EQ(stores, 7);
+    EXPECT_EQ(stored.size(), 7);
     // What has no limit is cut by the record, and a font is never smaller than 8.
     state.edit.TextFontSize = 98;
     page().Image1_MouseDown();
     page().Timer2_Tick();
     EXPECT_EQ(state.edit.TextFontSize, 100);
-    EXPECT_EQ(stored().TextFontSize, 10);
+    EXPECT_EQ(kept().TextFontSize, 10);
     state.edit.TextFontSize = 8;
     page().Image2_MouseDown();
     page().Timer2_Tick();
     EXPECT_EQ(state.edit.TextFontSize, 6);
-    EXPECT_EQ(stored().TextFontSize, 8);
+    EXPECT_EQ(kept().TextFontSize, 8);
     state.edit.TextX = 32767;
     page().Image15_MouseDown(1);
     page().Timer1_Tick();
@@ -180,33 +145,33 @@ TEST_F(CaptionKeys, styleDirectionAndAlignmentGoTheirRounds) {
     QList<int> styles;
     for (int i = 0; i < 4; ++i) {
         page().Image3_Click();
-        styles += stored().TextStyle;
+        styles += kept().TextStyle;
     }
     EXPECT_EQ(styles, (QList<int>{1, 2, 3, 0}));
     QList<int> directions;
     for (int i = 0; i < 2; ++i) {
         page().Image4_Click();
-        directions += stored().TextVertical;
+        directions += kept().TextVertical;
     }
     EXPECT_EQ(directions, (QList<int>{3, 0}));
     for (const int alignment : {2, 1, 0}) {
         page().Image5_Click(alignment);
-        EXPECT_EQ(stored().TextAlign, alignment);
+        EXPECT_EQ(kept().TextAlign, alignment);
         EXPECT_TRUE(page().Image5[static_cast<std::size_t>(alignment)].checked);
     }
-    EXPECT_EQ(stores, 9);
+    EXPECT_EQ(stored.size(), 9);
 }
 
 TEST_F(CaptionKeys, thePaletteGivesTheColourOfThePressedPixel) {
     const QImage& palette = page().Picture18Image.image();
     for (const QPoint at : {QPoint(0, 0), QPoint(palette.width() / 2, 20), palette.rect().bottomRight()}) {
         page().Picture18_MouseDown(at);
-        const EditFields kept = stored();
-        EXPECT_EQ(qRgb(kept.TextRed, kept.TextGreen, kept.TextBlue), palette.pixel(at));
+        const EditFields fields = kept();
+        EXPECT_EQ(qRgb(fields.TextRed, fields.TextGreen, fields.TextBlue), palette.pixel(at));
     }
-    stores = 0;
+    stored.clear();
     page().Picture18_MouseDown({palette.width(), 0});
-    EXPECT_EQ(stores, 0);
+    EXPECT_EQ(stored.size(), 0);
 }
 
 TEST_F(CaptionKeys, theFontListHoldsOneFont) {
@@ -214,13 +179,13 @@ TEST_F(CaptionKeys, theFontListHoldsOneFont) {
     page().Command10_Click();
     page().Command10_Click();
     EXPECT_EQ(page().Combo1List.items(), QStringList{u"David"_s});
-    EXPECT_EQ(stored().TextFont, u"David"_s);
+    EXPECT_EQ(kept().TextFont, u"David"_s);
 }
 
 TEST_F(CaptionKeys, aRealKeyboardDoesWhatTheKeysDo) {
     for (const QChar character : u"Ab \"ש\rx\b"_s)
         page().KeyPress(character);
-    EXPECT_EQ(stored().TextBody, page().Text1.text);
+    EXPECT_EQ(kept().TextBody, page().Text1.text);
     EXPECT_EQ(page().Text1.text, u"Ab \u05F4ש\r\n"_s);
     page().KeyPress(u'\u0416');
     for (const QChar half : QString::fromUcs4(U"\U0001F600"))

@@ -61,50 +61,6 @@ TEST(ABasketLine, splitsIntoWhatItWasComposedOfInBothForms) {
     EXPECT_EQ(back.editState, EditRecord::newPicture());
 }
 
-TEST(AnEditRecord, unpacksByPositionAndReadsBlanksAsTheirDefaults) {
-    EditFields fields;
-    fields.PicturePath = path;
-    UnpackEditState(EditRecord::newPicture(), fields);
-    EXPECT_EQ(fields.GainB, 1.0F);
-    EXPECT_EQ(fields.RotationCode, 180);
-    EXPECT_EQ(fields.PanY, 999);
-    EXPECT_EQ(fields.AutoMarker, u"000"_s);
-    EXPECT_EQ(fields.TextFontSize, 8);
-    EXPECT_EQ(fields.EditState.size(), 200);
-    EXPECT_EQ(fields.PicturePath, path);
-
-    // One character of its own at the start of each field shows that no column is shifted.
-    const QString record = u"1.290.5 0.02170210-99 12  1  2  034R11RED111"_s + LeftField(u"kids"_s, 10) +
-                           u"242 7 8 1 ddd       255128 1 45 60 9  3 2 "_s + LeftField(u"David"_s, 30) +
-                           LeftField(u"שלום  עולם"_s, 70);
-    UnpackEditState(record, fields);
-    EXPECT_FLOAT_EQ(fields.GainR, 1.29F);
-    EXPECT_FLOAT_EQ(fields.GainB, 0.02F);
-    EXPECT_EQ(fields.RotationCode, 170);
-    EXPECT_EQ(fields.ZoomPercent, 210);
-    EXPECT_EQ(fields.PanX, -99);
-    EXPECT_EQ(fields.PanY, 12);
-    EXPECT_EQ(fields.ToneFlag, 1);
-    EXPECT_EQ(fields.SpareFlag, 2);
-    EXPECT_EQ(fields.FrameName, u"034"_s);
-    EXPECT_EQ(fields.LineFrameCode, u"R11"_s);
-    EXPECT_EQ(fields.RedMarker, u"RED"_s);
-    EXPECT_EQ(fields.FrameFolder, u"kids"_s);
-    EXPECT_EQ(fields.TextFontSize, 24);
-    EXPECT_EQ(fields.TextAlign, 2);
-    EXPECT_EQ(fields.TextOn, 1);
-    EXPECT_EQ(fields.Tag, u"ddd"_s);
-    EXPECT_EQ(fields.TextBlue, 255);
-    EXPECT_EQ(fields.TextGreen, 128);
-    EXPECT_EQ(fields.TextRed, 1);
-    EXPECT_EQ(fields.TextX, 45);
-    EXPECT_EQ(fields.TextY, 60);
-    EXPECT_EQ(fields.TextVertical, 3);
-    EXPECT_EQ(fields.TextStyle, 2);
-    EXPECT_EQ(fields.TextFont, u"David"_s);
-    EXPECT_EQ(fields.TextBody, u"שלום  עולם"_s);
-}
-
 QString plainLine(int copies, const QString& of) {
     return BasketLine{{copies, u"1015"_s, u'G', u"NB"_s}, {}, of}.compose(LineForm::Short);
 }
@@ -171,16 +127,6 @@ QStringList names(int count) {
     for (int i = 1; i <= count; ++i)
         list += u"%1.jpg"_s.arg(i, 2, 10, QLatin1Char('0'));
     return list;
-}
-
-TEST(AFolderPager, showsThirteenPicturesAsTwelveThenTheLastOneAgainAndAgain) {
-    FolderPager pager;
-    EXPECT_EQ(pager.addFolder(u"C:\\p"_s, names(13)), 13);
-    EXPECT_EQ(pager.FillPageList().size(), 12);
-    EXPECT_EQ(pager.FillPageList(), QStringList(u"C:\\p\\13.jpg"_s));
-    EXPECT_EQ(pager.FillPageList(), QStringList(u"C:\\p\\13.jpg"_s));
-    pager.PageBack();
-    EXPECT_EQ(pager.FillPageList().first(), u"C:\\p\\01.jpg"_s);
 }
 
 TEST(AFolderPager, beginsBehindASecondFolderWithTheLastPictureOfTheFirst) {

@@ -119,14 +119,6 @@ TEST_F(ThePictures, stayAsTheyAreWhenTheDialogIsCancelled) {
     EXPECT_EQ(machine.dialogs.pickRequests.last(), u"בחר תמונה אחת בלבד |C:\\|Open"_s);
 }
 
-TEST_F(ThePictures, ofADriveRootCarryOneBackslashAndStandOnce) {
-    makePictures(u"C:\\"_s, 2);
-    kyoskNew& page = open();
-    for (int i = 0; i < 2; ++i)
-        pick(page, u"C:\\02.jpg"_s);
-    EXPECT_EQ(page.List4.paths().items(), QStringList({u"C:\\01.jpg"_s, u"C:\\02.jpg"_s}));
-}
-
 TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesOnly) {
     kyoskNew& page = openWith(2);
     pick(page, u"C:\\?\\01.jpg"_s);

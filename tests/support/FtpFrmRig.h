@@ -87,6 +87,12 @@ public:
         return bytes;
     }
 
+    // These files are to be sent again, as the page of finished orders asks for it.
+    void takeUpAgain(const QStringList& leaves) {
+        state.transfer.SugMishloah = 1;
+        for (const QString& leaf : leaves)
+            state.handOver.lines += local(leaf);
+    }
     // The page comes to the front and acts.
     FtpFrm& start() {
         chain.show(PageId::FtpFrm);

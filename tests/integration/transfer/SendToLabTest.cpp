@@ -11,7 +11,6 @@
 #include <QRegularExpression>
 
 #include <filesystem>
-#include <utility>
 
 // A prepared order, the sending page, a real FTP server behind a bad line, and a real web server.
 namespace lumora {
@@ -50,9 +49,7 @@ protected:
     // The customer takes the order up again on the page of finished orders.
     void resend() {
         rig.chain.unload(PageId::FtpFrm);
-        rig.state.transfer.SugMishloah = 1;
-        for (const QString& name : FtpFrmRig::names().mid(0, 4))
-            rig.state.handOver.lines += FtpFrmRig::local(name);
+        rig.takeUpAgain(FtpFrmRig::names().mid(0, 4));
         rig.send();
     }
 
@@ -105,29 +102,18 @@ QByteArray requestLine(const QString& address) {
 }
 
 TcpRelay::Faults refusedPut(int times) {
-    TcpRelay::Faults faults;
-    faults.command = "STOR " + FtpFrmRig::first().toLatin1();
-    faults.reply = "553 Could not create file.";
-    faults.times = times;
-    return faults;
-}
-
-TcpRelay::Faults cutPut(int times) {
-    TcpRelay::Faults faults;
-    faults.cutDataAfter = cutAt;
-    faults.times = times;
-    return faults;
+    return {.command = "STOR " + FtpFrmRig::first().toLatin1(), .reply = "553 Could not create file.", .times = times};
 }
 
 struct LineFault {
     const char* name = "";
-    TcpRelay::Faults faults;
-    QString backAt; // the attempt at which the line is good again; empty: as the faults say
+    TcpRelay::Faults faults = {};
+    QString backAt = {}; // the attempt at which the line is good again; empty: as the faults say
     QString password = LabServers::password();
     bool fromEarlierTry = false; // one file lies in the order's folder on the server already
     // What is told.
     bool success = true;
-    QString attempt;
+    QString attempt = {};
     int puts = 0;
     QStringList neverArrives = {};
 };
@@ -136,44 +122,9 @@ void PrintTo(const LineFault& fault, std::ostream* out) {
     *out << fault.name;
 }
 
-TcpRelay::Faults deadServer() {
-    TcpRelay::Faults faults;
-    faults.refuseConnections = true;
-    return faults;
-}
-
-LineFault back(const char* name, const QString& attempt) {
-    LineFault fault;
-    fault.name = name;
-    fault.faults = deadServer();
-    fault.backAt = attempt;
-    fault.attempt = attempt;
-    fault.puts = 5;
-    return fault;
-}
-
-LineFault faultOf(const char* name, const TcpRelay::Faults& faults, bool success, const QString& attempt, int puts,
-                  const QStringList& neverArrives = {}) {
-    LineFault fault;
-    fault.name = name;
-    fault.faults = faults;
-    fault.success = success;
-    fault.attempt = attempt;
-    fault.puts = puts;
-    fault.neverArrives = neverArrives;
-    return fault;
-}
-
-LineFault wrongPassword() {
-    LineFault fault = faultOf("login_refused", {}, false, fourth, 0, FtpFrmRig::names());
-    fault.password = u"wrong"_s;
-    return fault;
-}
-
-LineFault earlierTry() {
-    LineFault fault = faultOf("folder_exists_from_an_earlier_try", {}, true, QString(), 4);
-    fault.fromEarlierTry = true;
-    return fault;
+// Nobody answers until that attempt.
+LineFault backAt(const char* name, const QString& attempt) {
+    return {.name = name, .faults = {.refuseConnections = true}, .backAt = attempt, .attempt = attempt, .puts = 5};
 }
 
 class FaultsOfTheLine : public SendToLab, public ::testing::WithParamInterface<LineFault> {};
@@ -204,8 +155,7 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
     if (fault.fromEarlierTry) {
         // An earlier order of one file, by the same road.
         rig.state.profile.ReportOn = 0;
-        rig.state.transfer.SugMishloah = 1;
-        rig.state.handOver.lines = {FtpFrmRig::local(FtpFrmRig::first())};
+        rig.takeUpAgain({FtpFrmRig::first()});
         rig.send();
         ASSERT_EQ(rig.page().Label3.text, uploaded);
         rig.chain.unload(PageId::FtpFrm);
@@ -253,32 +203,32 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
 
 INSTANTIATE_TEST_SUITE_P(
     SendToLab, FaultsOfTheLine,
-    ::testing::Values(wrongPassword(), earlierTry(), faultOf("put_refused_once", refusedPut(1), true, second, 5),
-                      faultOf("put_refused_always", refusedPut(-1), false, fourth, 4, {FtpFrmRig::first()}),
-                      faultOf("cut_in_the_middle_of_a_file", cutPut(1), true, second, 6),
-                      faultOf("cut_there_each_time", cutPut(-1), false, fourth, 8, {FtpFrmRig::second()}),
-                      back("server_back_at_the_second_attempt", second),
-                      back("server_back_at_the_third_attempt", third),
-                      back("server_back_at_the_fourth_attempt", fourth)),
+    ::testing::Values(LineFault{.name = "login_refused",
+                                .password = u"wrong"_s,
+                                .success = false,
+                                .attempt = fourth,
+                                .neverArrives = FtpFrmRig::names()},
+                      LineFault{.name = "folder_exists_from_an_earlier_try", .fromEarlierTry = true, .puts = 4},
+                      LineFault{.name = "put_refused_once", .faults = refusedPut(1), .attempt = second, .puts = 5},
+                      LineFault{.name = "put_refused_always",
+                                .faults = refusedPut(-1),
+                                .success = false,
+                                .attempt = fourth,
+                                .puts = 4,
+                                .neverArrives = {FtpFrmRig::first()}},
+                      LineFault{.name = "cut_in_the_middle_of_a_file",
+                                .faults = {.cutDataAfter = cutAt, .times = 1},
+                                .attempt = second,
+                                .puts = 6},
+                      LineFault{.name = "cut_there_each_time",
+                                .faults = {.cutDataAfter = cutAt},
+                                .success = false,
+                                .attempt = fourth,
+                                .puts = 8,
+                                .neverArrives = {FtpFrmRig::second()}},
+                      backAt("server_back_at_the_second_attempt", second),
+                      backAt("server_back_at_the_third_attempt", third),
+                      backAt("server_back_at_the_fourth_attempt", fourth)),
     [](const ::testing::TestParamInfo<LineFault>& each) { return each.param.name; });
-
-TEST_F(SendToLab, AStopEndsThePassAndGoingOnSendsTheRest) {
-    FtpFrm& page = rig.start();
-    bool stopped = false;
-    QObject::connect(&page, &Page::changed, &page, [&page, &stopped] {
-        // While the second of five files is on its way.
-        if (page.Label4File.hint == FtpFrmRig::sheet() && !std::exchange(stopped, true))
-            page.Command15_Click();
-    });
-    rig.countDown();
-    EXPECT_EQ(rig.test.dialogs.messages.size(), 2);
-    const auto sent = puts();
-    EXPECT_EQ(sent, FtpFrmRig::names().mid(0, 2));
-    EXPECT_EQ(lab.requests().size(), 0);
-    page.Command10_Click();
-    EXPECT_EQ(page.Label3.text, uploaded);
-    EXPECT_EQ(puts(), FtpFrmRig::names());
-    expectArrived();
-}
 
 } // namespace lumora
