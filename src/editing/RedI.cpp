@@ -220,23 +220,23 @@ void RedI::Arrow_MouseUp() {
 }
 
 void RedI::Timer2_Tick() {
-    m_ticked = true;
-    moveCircle(0, -arrowStep);
+    if (m_held.ticks(Timer2))
+        moveCircle(0, -arrowStep);
 }
 
 void RedI::Timer3_Tick() {
-    m_ticked = true;
-    moveCircle(0, arrowStep);
+    if (m_held.ticks(Timer3))
+        moveCircle(0, arrowStep);
 }
 
 void RedI::Timer4_Tick() {
-    m_ticked = true;
-    moveCircle(-arrowStep, 0);
+    if (m_held.ticks(Timer4))
+        moveCircle(-arrowStep, 0);
 }
 
 void RedI::Timer5_Tick() {
-    m_ticked = true;
-    moveCircle(arrowStep, 0);
+    if (m_held.ticks(Timer5))
+        moveCircle(arrowStep, 0);
 }
 
 void RedI::CommandCloser_Click() {
@@ -311,8 +311,8 @@ void RedI::Size_MouseUp() {
 }
 
 void RedI::Timer1_Tick() {
-    m_ticked = true;
-    resizeCircle(m_sizeStep);
+    if (m_held.ticks(Timer1))
+        resizeCircle(m_sizeStep);
 }
 
 void RedI::Combo1_Change(int index) {
@@ -337,29 +337,16 @@ void RedI::resizeCircle(int by) {
 
 void RedI::startHold(Ticker& timer) {
     stopHolds();
-    m_ticked = false;
     if (canCorrect())
-        timer.start();
+        m_held.press(timer);
 }
 
 void RedI::tickOnceIfNone() {
-    if (m_ticked)
-        return;
-    if (Timer1.running())
-        Timer1_Tick();
-    else if (Timer2.running())
-        Timer2_Tick();
-    else if (Timer3.running())
-        Timer3_Tick();
-    else if (Timer4.running())
-        Timer4_Tick();
-    else if (Timer5.running())
-        Timer5_Tick();
+    m_held.tickOnceIfNone();
 }
 
 void RedI::stopHolds() {
-    for (Ticker* timer : {&Timer1, &Timer2, &Timer3, &Timer4, &Timer5})
-        timer->stop();
+    m_held.release();
 }
 
 // Leaving

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "editing/DragHandle.h"
+#include "editing/HeldButton.h"
 #include "editing/RedEye.h"
 #include "editing/RedUndoCopy.h"
 #include "imaging/Bitmap.h"
@@ -221,7 +222,7 @@ private:
     DragHandle m_drag;
     QPointF m_pressed; // where the drag began
     bool m_dragged = false;
-    bool m_ticked = false; // since a button was held down
+    HeldButton m_held;
     Step m_step = Step::FindEye;
 };
 

@@ -255,36 +255,27 @@ void mikledet::Image15_MouseUp() {
 }
 
 void mikledet::holdSize(std::int16_t by) {
-    stopHolding();
     SizeStep = by;
-    m_ticked = false;
-    m_timer2.start();
+    m_held.press(m_timer2);
 }
 
 void mikledet::holdMove(std::int16_t x, std::int16_t y) {
-    stopHolding();
     MoveStepX = x;
     MoveStepY = y;
-    m_ticked = false;
-    m_timer1.start();
+    m_held.press(m_timer1);
 }
 
 void mikledet::stopHolding() {
-    m_timer1.stop();
-    m_timer2.stop();
+    m_held.release();
 }
 
 void mikledet::tickOnceIfNone() {
-    if (m_ticked)
-        return;
-    if (m_timer1.running())
-        Timer1_Tick();
-    else if (m_timer2.running())
-        Timer2_Tick();
+    m_held.tickOnceIfNone();
 }
 
 void mikledet::Timer1_Tick() {
-    m_ticked = true;
+    if (!m_held.ticks(m_timer1))
+        return;
     EditFields& edit = m_state.edit;
     edit.TextX = HoldIn16Bits(edit.TextX + MoveStepX);
     edit.TextY = HoldIn16Bits(edit.TextY + MoveStepY);
@@ -292,7 +283,8 @@ void mikledet::Timer1_Tick() {
 }
 
 void mikledet::Timer2_Tick() {
-    m_ticked = true;
+    if (!m_held.ticks(m_timer2))
+        return;
     m_state.edit.TextFontSize = HoldIn16Bits(m_state.edit.TextFontSize + SizeStep);
     commitText();
 }

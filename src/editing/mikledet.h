@@ -1,5 +1,6 @@
 #pragma once
 
+#include "editing/HeldButton.h"
 #include "editing/KeyLayout.h"
 #include "imaging/Bitmap.h"
 #include "session/Caption.h"
@@ -105,7 +106,7 @@ private:
     PageChain& m_chain;
     Ticker m_timer1;
     Ticker m_timer2;
-    bool m_ticked = false; // since something was last pressed down
+    HeldButton m_held;
 };
 
 } // namespace lumora

@@ -3,6 +3,7 @@
 #include "editing/CropFrame.h"
 #include "editing/DragHandle.h"
 #include "editing/FrameLists.h"
+#include "editing/HeldButton.h"
 #include "editing/LineFramePalette.h"
 #include "editing/TextLabelPlace.h"
 #include "imaging/Bitmap.h"
@@ -265,9 +266,8 @@ private:
     DragHandle m_cropHandle;
     CropFrame::Corner m_cropCorner = CropFrame::Corner::Picture11;
     Ticker Timer2, Timer3, Timer6, Timer7, Timer8;
-    Ticker* m_held = nullptr;
+    HeldButton m_held;
     int m_step = 0; // of the held button, a tick
-    int m_ticks = 0;
     bool m_open = false;
     unsigned m_openings = 0;
     bool m_workFileFailed = false;

@@ -27,9 +27,8 @@ void tFrmNew::setGains(float red, float green, float blue) {
 
 // Stored when the button is let go.
 void tFrmNew::Timer3_Tick() {
-    if (m_held != &Timer3)
+    if (!m_held.ticks(Timer3))
         return;
-    ++m_ticks;
     setGains(EditStep::gain(edit().GainR, m_step), EditStep::gain(edit().GainG, m_step),
              EditStep::gain(edit().GainB, m_step));
     RenderPreview();

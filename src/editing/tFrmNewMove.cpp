@@ -30,18 +30,14 @@ void tFrmNew::hold(Ticker& ticker, int step) {
     stopHolds(); // a second finger takes over
     if (!m_open)
         return;
-    m_held = &ticker;
     m_step = step;
-    m_ticks = 0;
-    ticker.start();
+    m_held.press(ticker);
     Q_EMIT changed();
 }
 
 // Without what a MouseUp does besides: the fields may be those of another picture by now.
 void tFrmNew::dropHold() {
-    if (m_held != nullptr)
-        m_held->stop();
-    m_held = nullptr;
+    m_held.release();
     sunkImage2 = -1;
     Image3.release();
     m_labelHandle.release();
@@ -49,14 +45,13 @@ void tFrmNew::dropHold() {
 }
 
 void tFrmNew::endHold(Release release) {
-    const Ticker* held = m_held;
-    if (m_held != nullptr)
-        m_held->stop();
-    m_held = nullptr;
+    const bool zoomed = m_held.holds(Timer2);
+    const bool brightened = m_held.holds(Timer3);
+    m_held.release();
     sunkImage2 = -1;
-    if (held == &Timer2)
+    if (zoomed)
         zoomReleased(release);
-    else if (held == &Timer3)
+    else if (brightened)
         StoreCurrentEdit();
     Q_EMIT changed();
 }
@@ -71,18 +66,7 @@ void tFrmNew::stopHolds() {
 }
 
 void tFrmNew::tickOnceIfNone() {
-    if (m_held == nullptr || m_ticks > 0)
-        return;
-    if (m_held == &Timer2)
-        Timer2_Tick();
-    else if (m_held == &Timer3)
-        Timer3_Tick();
-    else if (m_held == &Timer6)
-        Timer6_Tick();
-    else if (m_held == &Timer7)
-        Timer7_Tick();
-    else
-        Timer8_Tick();
+    m_held.tickOnceIfNone();
 }
 
 void tFrmNew::Image2_MouseDown(int index) {
@@ -92,7 +76,7 @@ void tFrmNew::Image2_MouseDown(int index) {
         hold(Timer3, index == lighter ? brightnessStep : -brightnessStep);
     else
         return;
-    if (m_held != nullptr)
+    if (m_held.isHeld())
         sunkImage2 = index;
 }
 
@@ -106,9 +90,8 @@ void tFrmNew::Image2_MouseMove() {
 
 // Packing and storing wait for the release: drawing alone is what the eye needs meanwhile.
 void tFrmNew::Timer2_Tick() {
-    if (m_held != &Timer2)
+    if (!m_held.ticks(Timer2))
         return;
-    ++m_ticks;
     PreviewZoom = EditStep::zoom(PreviewZoom, m_step);
     edit().ZoomPercent = PreviewZoom;
     RenderPreview();
@@ -127,25 +110,22 @@ void tFrmNew::zoomReleased(Release release) {
 }
 
 void tFrmNew::Timer6_Tick() {
-    if (m_held != &Timer6)
+    if (!m_held.ticks(Timer6))
         return;
-    ++m_ticks;
     edit().RotationCode = EditStep::turn(edit().RotationCode, m_step);
     showNumbers();
     renderPackStore();
 }
 
 void tFrmNew::Timer7_Tick() {
-    if (m_held != &Timer7)
+    if (!m_held.ticks(Timer7))
         return;
-    ++m_ticks;
     panBy(QPointF(m_step, 0));
 }
 
 void tFrmNew::Timer8_Tick() {
-    if (m_held != &Timer8)
+    if (!m_held.ticks(Timer8))
         return;
-    ++m_ticks;
     panBy(QPointF(0, m_step));
 }
 

@@ -2,9 +2,10 @@
 
 namespace lumora {
 
-Ticker::Ticker(int milliseconds, std::function<void()> tick) {
+Ticker::Ticker(int milliseconds, std::function<void()> tick)
+    : m_tick(std::move(tick)) {
     m_timer.setInterval(milliseconds);
-    QObject::connect(&m_timer, &QTimer::timeout, std::move(tick));
+    QObject::connect(&m_timer, &QTimer::timeout, m_tick);
 }
 
 void Ticker::start() {

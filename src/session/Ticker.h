@@ -13,11 +13,13 @@ public:
 
     void start();
     void stop() { m_timer.stop(); }
+    void tick() { m_tick(); } // now, and the running time goes on
     bool running() const { return m_timer.isActive(); }
     int interval() const { return m_timer.interval(); }
     void setInterval(int milliseconds) { m_timer.setInterval(milliseconds); }
 
 private:
+    std::function<void()> m_tick;
     QTimer m_timer;
 };
 
