@@ -49,20 +49,18 @@ void B3::load() {
 }
 
 void B3::setTexts() {
-    const auto say = [this](const char16_t* hebrew, const char16_t* english) {
-        return m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
-    };
-    Label4Title.text = say(u"הכנת תמונות למשלוח", u"Preparing your pictures");
+    const SessionState& s = m_state;
+    Label4Title.text = s.wording(u"הכנת תמונות למשלוח", u"Preparing your pictures");
     Label1.text = doNotDelete(m_state);
     Label2.text = untilPrinted(m_state);
-    Command1.text = say(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
-    Command5.text = say(u"הכן את ההזמנה", u"Prepare the order");
+    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
+    Command5.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
     // The same button in the two languages of the page.
     Command2.text = QStringLiteral(" Stop All and EXIT");
     Command2.visible = m_state.english();
-    Command7.text = say(u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program");
+    Command7.text = s.wording(u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program");
     Command7.visible = !m_state.english();
-    Picture5.text = say(u"דף ההזמנה", u"Order sheet");
+    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
     showProgress();
     Q_EMIT changed();
 }

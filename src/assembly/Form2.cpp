@@ -92,20 +92,18 @@ void Form2::load() {
 }
 
 void Form2::setTexts() {
-    const auto say = [this](const char16_t* hebrew, const char16_t* english) {
-        return m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
-    };
-    Label1.text = say(u"מארז תמונות", u"Preparing your pictures");
+    const SessionState& s = m_state;
+    Label1.text = s.wording(u"מארז תמונות", u"Preparing your pictures");
     Label6.text = doNotDelete(m_state);
     Label10.text = untilPrinted(m_state);
-    Command1.text = say(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
-    Command3.text = say(u"הכן את ההזמנה", u"Prepare the order");
-    Command4.text = say(u"הצג דף אלבום", u"Show the album sheet");
-    Command5.text = say(u"צייר שוב את התמונות", u"Draw the pictures again");
-    Command6.text = say(u"הכן את ההזמנה עכשיו", u"Prepare the order now");
-    Command7.text = say(u"EXIT  יציאה", u"EXIT");
-    Command8.text = say(u"החזר את הדף למקומו", u"Put the sheet back");
-    Picture5.text = say(u"דף ההזמנה", u"Order sheet");
+    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
+    Command3.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
+    Command4.text = s.wording(u"הצג דף אלבום", u"Show the album sheet");
+    Command5.text = s.wording(u"צייר שוב את התמונות", u"Draw the pictures again");
+    Command6.text = s.wording(u"הכן את ההזמנה עכשיו", u"Prepare the order now");
+    Command7.text = s.wording(u"EXIT  יציאה", u"EXIT");
+    Command8.text = s.wording(u"החזר את הדף למקומו", u"Put the sheet back");
+    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
     showProgress();
     Q_EMIT changed();
 }

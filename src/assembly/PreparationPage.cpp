@@ -20,14 +20,14 @@ PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform&
     , m_chain(chain) {}
 
 QString PreparationPage::doNotDelete(const SessionState& state) {
-    return state.wording(QStringLiteral("אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת"),
-                         QStringLiteral("If you mean to delete the pictures from the computer, the camera or any other "
-                                        "medium,"));
+    return state.wording(u"אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת",
+                         u"If you mean to delete the pictures from the computer, the camera or any other "
+                         "medium,");
 }
 
 QString PreparationPage::untilPrinted(const SessionState& state) {
-    return state.wording(QStringLiteral("אל תמחק אותם עד אשר תקבל את התמונות מודפסות"),
-                         QStringLiteral("do not delete them until you hold the printed pictures in your hands"));
+    return state.wording(u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות",
+                         u"do not delete them until you hold the printed pictures in your hands");
 }
 
 bool PreparationPage::takeLines() {
@@ -70,37 +70,31 @@ void PreparationPage::showProgress() {
     Label17.text = m_stage == Stage::Pictures ? position : QString();
     switch (m_stage) {
     case Stage::Waiting:
-        Label4Progress.text =
-            m_state.wording(QStringLiteral("ההזמנה עוד לא הוכנה"), QStringLiteral("The order is not prepared yet"));
+        Label4Progress.text = m_state.wording(u"ההזמנה עוד לא הוכנה", u"The order is not prepared yet");
         break;
     case Stage::Checking:
-        Label4Progress.text =
-            m_state.wording(QStringLiteral("בודק את רשימת התמונות"), QStringLiteral("Checking the list of pictures"));
+        Label4Progress.text = m_state.wording(u"בודק את רשימת התמונות", u"Checking the list of pictures");
         break;
     case Stage::Sheet:
-        Label4Progress.text = m_state
-                                  .wording(QStringLiteral("מצייר את דף ההזמנה: תמונה %1 מתוך %2"),
-                                           QStringLiteral("Drawing the order sheet: picture %1 of %2"))
-                                  .arg(position, count);
+        Label4Progress.text =
+            m_state.wording(u"מצייר את דף ההזמנה: תמונה %1 מתוך %2", u"Drawing the order sheet: picture %1 of %2")
+                .arg(position, count);
         break;
     case Stage::Pictures:
-        Label4Progress.text = m_state
-                                  .wording(QStringLiteral("מכין תמונה מספר %1 מתוך %2 תמונות שבחרת"),
-                                           QStringLiteral("Preparing picture %1 of the %2 that you chose"))
-                                  .arg(position, count);
+        Label4Progress.text =
+            m_state
+                .wording(u"מכין תמונה מספר %1 מתוך %2 תמונות שבחרת", u"Preparing picture %1 of the %2 that you chose")
+                .arg(position, count);
         break;
     case Stage::Closing:
-        Label4Progress.text =
-            m_state.wording(QStringLiteral("רושם את פרטי ההזמנה"), QStringLiteral("Writing down the order's details"));
+        Label4Progress.text = m_state.wording(u"רושם את פרטי ההזמנה", u"Writing down the order's details");
         break;
     case Stage::Done:
-        Label4Progress.text = m_state.wording(QStringLiteral("ההזמנה מוכנה"), QStringLiteral("The order is ready"));
+        Label4Progress.text = m_state.wording(u"ההזמנה מוכנה", u"The order is ready");
         break;
     }
     Label4fail.visible = !List4fail.isEmpty();
-    Label4fail.text = m_state
-                          .wording(QStringLiteral("%1 תמונות לא ניתן היה להכין:"),
-                                   QStringLiteral("Pictures that could not be prepared: %1"))
+    Label4fail.text = m_state.wording(u"%1 תמונות לא ניתן היה להכין:", u"Pictures that could not be prepared: %1")
                           .arg(List4fail.count());
 }
 
@@ -175,10 +169,9 @@ bool PreparationPage::writeLog(const OrderFolder& folder, const QByteArray& log)
 void PreparationPage::handOver(std::optional<PageId> next) {
     m_handedOver = true;
     m_state.transfer.SugMishloah = 0;
-    const QString prepared = m_state
-                                 .wording(QStringLiteral("הזמנה מספר %1 מוכנה ונשמרה בתחנה."),
-                                          QStringLiteral("Order number %1 is ready and kept at this station."))
-                                 .arg(m_state.MisparHazmana);
+    const QString prepared =
+        m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
+            .arg(m_state.MisparHazmana);
     if (!next) {
         m_state.handOver.notice = prepared;
     } else if (!m_chain.isRegistered(*next)) {

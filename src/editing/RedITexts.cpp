@@ -8,7 +8,7 @@ namespace lumora {
 
 void RedI::setTexts() {
     const auto say = [this](const char16_t* hebrew, const char16_t* english) {
-        return m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        return m_state.wording(hebrew, english);
     };
     kofez.text = QStringLiteral("Kizoor");
     Label38.text =

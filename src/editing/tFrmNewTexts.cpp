@@ -6,10 +6,10 @@ namespace lumora {
 
 void tFrmNew::setTexts() {
     const auto set = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.text = m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        caption.text = m_state.wording(hebrew, english);
     };
     const auto setHint = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.hint = m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        caption.hint = m_state.wording(hebrew, english);
     };
     // A button that goes on as long as it is held says so behind its hint.
     const auto setHoldHint = [this, &setHint](Caption& caption, const char16_t* hebrew, const char16_t* english) {

@@ -33,9 +33,8 @@ std::optional<AlbumProblem> CheckAlbum(const SessionState& state, const QString&
     for (const auto& check : checks) {
         if (!check.missing)
             continue;
-        const QString message = check.hebrew
-                                    ? state.wording(QString::fromUtf16(check.hebrew), QString::fromUtf16(check.english))
-                                    : detailsMessages(state.english())[6];
+        const QString message =
+            check.hebrew ? state.wording(check.hebrew, check.english) : detailsMessages(state.english())[6];
         return AlbumProblem{message, check.place};
     }
     return std::nullopt;

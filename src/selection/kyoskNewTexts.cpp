@@ -15,10 +15,10 @@ void kyoskNew::setTexts() {
 
 void kyoskNew::setBrowserTexts() {
     const auto set = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.text = m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        caption.text = m_state.wording(hebrew, english);
     };
     const auto setHint = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.hint = m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        caption.hint = m_state.wording(hebrew, english);
     };
 
     Label15.text = m_state.shemot.ppr;
@@ -66,20 +66,20 @@ void kyoskNew::setBrowserTexts() {
     }
 
     set(Frame2, u"עזרה", u"Help");
-    set(Label9,
-        u"לחיצה על תמונה קטנה בוחרת אותה ומציגה אותה בגדול\n"
-        u"פלוס ומינוס קובעים את מספר העותקים\n"
-        u"תמונה של פחות ממיליון פיקסלים מציגה אזהרה על איכות נמוכה",
-        u"A click on a small picture chooses it and shows it large\n"
-        u"Plus and minus set the number of copies\n"
-        u"A picture of under a million pixels shows a warning of low quality");
+    Label9.text = (plain() ? m_state.wording(u"לחיצה על תמונה קטנה בוחרת אותה ומציגה אותה בגדול\n",
+                                             u"A click on a small picture chooses it and shows it large\n")
+                           : m_state.wording(u"לחיצה על תמונה קטנה בוחרת אותה ופותחת אותה לעריכה\n",
+                                             u"A click on a small picture chooses it and opens it for editing\n")) +
+                  m_state.wording(u"פלוס ומינוס קובעים את מספר העותקים\n"
+                                  u"תמונה של פחות ממיליון פיקסלים מציגה אזהרה על איכות נמוכה",
+                                  u"Plus and minus set the number of copies\n"
+                                  u"A picture of under a million pixels shows a warning of low quality");
 
-    const QString once =
-        m_state.wording(QStringLiteral("יש לבחור רק תמונה אחת"), QStringLiteral("Select one image only"));
-    const QString all = m_state.wording(QStringLiteral("והתוכנה תציג לפניך את כל התמונות"),
-                                        QStringLiteral("and the program will show you all the images"));
-    const QString fromFolder = m_state.wording(QStringLiteral("יש לבחור רק תמונה אחת מתוך תקייה"),
-                                               QStringLiteral("Select only one image of a folder"));
+    const QString once = m_state.wording(u"יש לבחור רק תמונה אחת", u"Select one image only");
+    const QString all =
+        m_state.wording(u"והתוכנה תציג לפניך את כל התמונות", u"and the program will show you all the images");
+    const QString fromFolder =
+        m_state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה", u"Select only one image of a folder");
     Pic4BroseLines = {once, all, fromFolder, once, all, fromFolder};
     Pic4Brose.text = once;
 
@@ -95,7 +95,7 @@ void kyoskNew::setBrowserTexts() {
 
 void kyoskNew::setClosingTexts() {
     const auto set = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.text = m_state.wording(QString::fromUtf16(hebrew), QString::fromUtf16(english));
+        caption.text = m_state.wording(hebrew, english);
     };
 
     set(Frame3, u"יציאה", u"Leaving");
@@ -146,30 +146,26 @@ void kyoskNew::setClosingTexts() {
 
 void kyoskNew::showGuide(Guide guide) {
     m_guide = guide;
+    const auto lines = [this](const char16_t* hebrew, const char16_t* english) {
+        return m_state.wording(hebrew, english).split(u'\n');
+    };
     switch (guide) {
     case Guide::None:
         return;
     case Guide::PicturesShown:
-        Picture2.guide = m_state.english()
-                             ? QStringList{QStringLiteral("   The small pictures are beside this"),
-                                           QStringLiteral("   Press a picture to choose it "),
-                                           QStringLiteral("   To cancel a choice press the minus button "),
-                                           QStringLiteral("<<<<<<<<<<<<<<")}
-                             : QStringList{QStringLiteral("   בצד שמאל תמונות קטנות"),
-                                           QStringLiteral("   אם לחצת על תמונה אז בחרת אותה "),
-                                           QStringLiteral("   רוצה לבטל בחירה אז לחץ על לחצן מינוס "),
-                                           QStringLiteral("<<<<<<<<<<<<<<")};
+        Picture2.guide =
+            lines(u"   בצד שמאל תמונות קטנות", u"   The small pictures are beside this") +
+            (plain() ? lines(u"   אם לחצת על תמונה אז בחרת אותה ", u"   Press a picture to choose it ")
+                     : lines(u"   אם לחצת על תמונה אז היא נפתחת לעריכה ", u"   Press a picture to edit it ")) +
+            lines(u"   רוצה לבטל בחירה אז לחץ על לחצן מינוס ", u"   To cancel a choice press the minus button ") +
+            lines(u"<<<<<<<<<<<<<<", u"<<<<<<<<<<<<<<");
         break;
     case Guide::ChooseByHand:
         Picture2.guide =
-            m_state.english()
-                ? QStringList{QStringLiteral("Please choose your pictures"),
-                              QStringLiteral("The small pictures are beside this"),
-                              QStringLiteral("Press a picture to choose it for print"),
-                              QStringLiteral("The plus and minus keys add copies and cancel")}
-                : QStringList{QStringLiteral("הנך מוזמן לבחור תמונות"), QStringLiteral("מצד שמאל תמונות קטנות"),
-                              QStringLiteral("לחצת על תמונה בחרת אותה להדפסה"),
-                              QStringLiteral("מקשי הפלוס והמינוס נועדו להוספה או ביטול")};
+            lines(u"הנך מוזמן לבחור תמונות\nמצד שמאל תמונות קטנות\nלחצת על תמונה בחרת אותה להדפסה\n"
+                  u"מקשי הפלוס והמינוס נועדו להוספה או ביטול",
+                  u"Please choose your pictures\nThe small pictures are beside this\n"
+                  u"Press a picture to choose it for print\nThe plus and minus keys add copies and cancel");
         break;
     }
     Picture2.bitmap = Bitmap();

@@ -205,6 +205,9 @@ struct SessionState {
     bool english() const { return EnglishTips == 1; }
     // The wording in the language of the session.
     QString wording(const QString& hebrew, const QString& inEnglish) const { return english() ? inEnglish : hebrew; }
+    QString wording(const char16_t* hebrew, const char16_t* inEnglish) const {
+        return QString::fromUtf16(english() ? inEnglish : hebrew);
+    }
 };
 
 } // namespace lumora
