@@ -6,6 +6,7 @@
 #include <QPainterPath>
 
 #include <algorithm>
+#include <utility>
 
 namespace lumora {
 namespace {
@@ -53,11 +54,22 @@ private:
     double m_height;
 };
 
+struct Fading {
+    int style;
+    Shape shape;
+    double shareOfWidth;
+    int firstAlpha, fall;
+};
+constexpr Fading fadingStyles[] = {
+    {3, Shape::Rectangle, 1, 255, 2},     {4, Shape::Ellipse, 1, 255, 2},  {13, Shape::Rectangle, 0.3, 255, 3},
+    {14, Shape::Ellipse, 0.3, 255, 3},    {15, Shape::Both, 0.07, 255, 3}, {16, Shape::Ellipse, 0.05, 205, 3},
+    {17, Shape::Rectangle, 0.05, 205, 3}, {18, Shape::Both, 0.06, 255, 3}, {19, Shape::Both, 0.06, 175, 3}};
+
 // Rectangles shrink into the box and ellipses grow out of it, each fainter than the one before.
-void drawFading(LinePainter& lines, Shape shape, double shareOfWidth, int firstAlpha, int fall) {
-    const int last = static_cast<int>(lines.width() * shareOfWidth);
-    for (int i = 0; i <= last && firstAlpha - fall * i > 0; ++i)
-        lines.draw(shape, i, -i, firstAlpha - fall * i, 0);
+void drawFading(LinePainter& lines, const Fading& fading) {
+    const int last = static_cast<int>(lines.width() * fading.shareOfWidth);
+    for (int i = 0; i <= last && fading.firstAlpha - fading.fall * i > 0; ++i)
+        lines.draw(fading.shape, i, -i, fading.firstAlpha - fading.fall * i, 0);
 }
 
 // From so far inside outwards, with a broad pen.
@@ -83,33 +95,16 @@ void drawEdge(LinePainter& lines, int style) {
 } // namespace
 
 std::optional<QColor> lineFrameColour(QChar letter) {
-    switch (letter.unicode()) {
-    case u'W':
-        return QColor(250, 250, 250);
-    case u'R':
-        return QColor(250, 100, 100);
-    case u'P':
-        return QColor(250, 0, 100);
-    case u'S':
-        return QColor(240, 120, 0);
-    case u'K':
-    case u'8':
-        return QColor(0, 0, 0);
-    case u'G':
-        return QColor(100, 250, 100);
-    case u'Y':
-        return QColor(250, 250, 0);
-    case u'H':
-        return QColor(120, 120, 120);
-    case u'B':
-        return QColor(40, 40, 250);
-    case u'T':
-        return QColor(0, 250, 250);
-    case u'U':
-        return QColor(110, 110, 250);
-    default:
-        return std::nullopt;
+    static constexpr std::pair<char16_t, QRgb> colours[] = {
+        {u'W', qRgb(250, 250, 250)}, {u'R', qRgb(250, 100, 100)}, {u'P', qRgb(250, 0, 100)},
+        {u'S', qRgb(240, 120, 0)},   {u'K', qRgb(0, 0, 0)},       {u'8', qRgb(0, 0, 0)},
+        {u'G', qRgb(100, 250, 100)}, {u'Y', qRgb(250, 250, 0)},   {u'H', qRgb(120, 120, 120)},
+        {u'B', qRgb(40, 40, 250)},   {u'T', qRgb(0, 250, 250)},   {u'U', qRgb(110, 110, 250)}};
+    for (const auto& [known, colour] : colours) {
+        if (letter == known)
+            return QColor(colour);
     }
+    return std::nullopt;
 }
 
 void PaintLineFrame(Bitmap& box, const QString& code) {
@@ -117,39 +112,18 @@ void PaintLineFrame(Bitmap& box, const QString& code) {
     if (box.isNull() || !colour)
         return;
     LinePainter lines(box, *colour);
+    const int style = code.mid(1).toInt();
     const auto rising = [](int i) { return 2 * (i - 1); };
     const auto steady = [](int) { return 9; };
-    const int style = code.mid(1).toInt();
-    switch (style) {
-    case 1:
-        return drawGrowing(lines, Shape::Rectangle, 20, rising);
-    case 2:
-        return drawGrowing(lines, Shape::Ellipse, 20, rising);
-    case 3:
-        return drawFading(lines, Shape::Rectangle, 1, 255, 2);
-    case 4:
-        return drawFading(lines, Shape::Ellipse, 1, 255, 2);
-    case 5:
-        return drawGrowing(lines, Shape::Rectangle, 30, steady);
-    case 6:
-        return drawGrowing(lines, Shape::Ellipse, 30, steady);
-    case 13:
-        return drawFading(lines, Shape::Rectangle, 0.3, 255, 3);
-    case 14:
-        return drawFading(lines, Shape::Ellipse, 0.3, 255, 3);
-    case 15:
-        return drawFading(lines, Shape::Both, 0.07, 255, 3);
-    case 16:
-        return drawFading(lines, Shape::Ellipse, 0.05, 205, 3);
-    case 17:
-        return drawFading(lines, Shape::Rectangle, 0.05, 205, 3);
-    case 18:
-        return drawFading(lines, Shape::Both, 0.06, 255, 3);
-    case 19:
-        return drawFading(lines, Shape::Both, 0.06, 175, 3);
-    default:
-        if (style >= 21 && style <= 50)
-            drawEdge(lines, style);
+    if (style == 1 || style == 2)
+        drawGrowing(lines, style == 1 ? Shape::Rectangle : Shape::Ellipse, 20, rising);
+    else if (style == 5 || style == 6)
+        drawGrowing(lines, style == 5 ? Shape::Rectangle : Shape::Ellipse, 30, steady);
+    else if (style >= 21 && style <= 50)
+        drawEdge(lines, style);
+    for (const Fading& fading : fadingStyles) {
+        if (fading.style == style)
+            drawFading(lines, fading);
     }
 }
 

@@ -120,12 +120,17 @@ Result<void> Workspace::MakeOrderFolder() const {
 
 Result<void> Workspace::CleanWorkspace() const {
     const QString orders = WorkspacePaths::orders(m_state);
-    deleteMatching(WorkspacePaths::ktanim(m_state), QStringLiteral("jpg"));
-    deleteMatching(WorkspacePaths::tempred(m_state), QStringLiteral("jpg"));
-    for (const QString& ending : {QStringLiteral("txt"), QStringLiteral("jpg"), QStringLiteral("bmp")})
-        deleteMatching(WorkspacePaths::jobFolder(m_state), ending);
-    for (const QString& ending : {QStringLiteral("gbr"), QStringLiteral("jpg"), QStringLiteral("gbx")})
-        deleteMatching(orders, ending);
+    const struct {
+        QString folder;
+        QStringList endings;
+    } scratch[] = {{WorkspacePaths::ktanim(m_state), {"jpg"}},
+                   {WorkspacePaths::tempred(m_state), {"jpg"}},
+                   {WorkspacePaths::jobFolder(m_state), {"txt", "jpg", "bmp"}},
+                   {orders, {"gbr", "jpg", "gbx"}}};
+    for (const auto& place : scratch) {
+        for (const QString& ending : place.endings)
+            deleteMatching(place.folder, ending);
+    }
 
     const Result<void> written = m_files.writeWhole(orders + QStringLiteral("\\mana.txt"), QByteArrayLiteral("1\r\n"));
 

@@ -255,30 +255,29 @@ void RedIView::makeMenu() {
     m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, page.CommandMenu, "title"));
     auto* grid = new QGridLayout;
     grid->setSpacing(theme().px(10));
+    const struct {
+        const char* name;
+        const Caption& caption;
+        void (RedI::*press)();
+        const char* icon;
+        Role role = Role::Plain;
+    } items[] = {{"Bsisi", page.Bsisi, &RedI::Bsisi_Click, "redeye-correct"},
+                 {"amok2", page.amok2, &RedI::amok2_Click, "redeye-correct"},
+                 {"amok3", page.amok3, &RedI::amok3_Click, "redeye-correct"},
+                 {"amok4", page.amok4, &RedI::amok4_Click, "redeye-correct"},
+                 {"amok5", page.amok5, &RedI::amok5_Click, "redeye-correct"},
+                 {"amok", page.amok, &RedI::amok_Click, "redeye-deeper"},
+                 {"Memokad", page.Memokad, &RedI::Memokad_Click, "redeye-correct"},
+                 {"Command3", page.Command3, &RedI::Command3_Click, "redeye-smaller"},
+                 {"Rstor", page.Rstor, &RedI::Rstor_Click, "eraser", Role::Danger}};
     int place = 0;
-    const auto item = [&](const QString& name, const Caption& caption, Role role, std::function<void()> pressed,
-                          const QString& icon) {
-        grid->addWidget(button(name, caption, role, std::move(pressed), icon), place / 2, place % 2);
+    for (const auto& item : items) {
+        const auto press = [&page, handler = item.press] { (page.*handler)(); };
+        grid->addWidget(
+            button(QString::fromLatin1(item.name), item.caption, item.role, press, QString::fromLatin1(item.icon)),
+            place / 2, place % 2);
         ++place;
-    };
-    item(
-        u"Bsisi"_s, page.Bsisi, Role::Plain, [&page] { page.Bsisi_Click(); }, u"redeye-correct"_s);
-    item(
-        u"amok2"_s, page.amok2, Role::Plain, [&page] { page.amok2_Click(); }, u"redeye-correct"_s);
-    item(
-        u"amok3"_s, page.amok3, Role::Plain, [&page] { page.amok3_Click(); }, u"redeye-correct"_s);
-    item(
-        u"amok4"_s, page.amok4, Role::Plain, [&page] { page.amok4_Click(); }, u"redeye-correct"_s);
-    item(
-        u"amok5"_s, page.amok5, Role::Plain, [&page] { page.amok5_Click(); }, u"redeye-correct"_s);
-    item(
-        u"amok"_s, page.amok, Role::Plain, [&page] { page.amok_Click(); }, u"redeye-deeper"_s);
-    item(
-        u"Memokad"_s, page.Memokad, Role::Plain, [&page] { page.Memokad_Click(); }, u"redeye-correct"_s);
-    item(
-        u"Command3"_s, page.Command3, Role::Plain, [&page] { page.Command3_Click(); }, u"redeye-smaller"_s);
-    item(
-        u"Rstor"_s, page.Rstor, Role::Danger, [&page] { page.Rstor_Click(); }, u"eraser"_s);
+    }
     auto* back = button(u"CommandMenuClose"_s, page.CommandMenuClose, Role::Secondary, [&page] { page.kofez_Close(); });
     grid->addWidget(back, place / 2, place % 2);
     m_menu->column()->addLayout(grid);
