@@ -1,6 +1,7 @@
 // edited_ticks FRAMES FILE [SCALE]: what one tick of a held button takes in the editor, with frame and caption, and
 // what opening the picture takes beside the scaled decode alone. Times are processor time of this thread.
 #include "Floor.h"
+#include "Timing.h"
 #include "editing/EditRecord.h"
 #include "editing/EditedPicture.h"
 #include "imaging/Resample.h"
@@ -10,28 +11,15 @@
 
 #include <cmath>
 #include <cstdio>
-#include <ctime>
 #include <functional>
 
 using namespace lumora;
 
 namespace {
 
-double milliseconds() {
-    timespec now{};
-    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
-    return static_cast<double>(now.tv_sec) * 1e3 + static_cast<double>(now.tv_nsec) / 1e6;
-}
-
-double timed(const std::function<void()>& work) {
-    const double begin = milliseconds();
-    work();
-    return milliseconds() - begin;
-}
-
-void tell(const char* what, std::vector<double> times) {
-    std::sort(times.begin(), times.end());
-    std::printf("%-36s median %6.2f ms, worst %6.2f ms\n", what, times[times.size() / 2], times.back());
+void tell(const char* what, const char* unit, const std::vector<double>& times) {
+    const Spread spread = spreadOf(times);
+    std::printf("%-36s median %6.2f%s, worst %6.2f%s\n", what, spread.median, unit, spread.highest, unit);
 }
 
 } // namespace
@@ -74,26 +62,25 @@ int main(int argc, char** argv) {
     const PictureSize wanted{static_cast<int>(work.width * scale), static_cast<int>(work.height * scale)};
     std::vector<double> ratios;
     for (int i = 0; i < 7; ++i) {
-        const double decode = timed([&] {
+        const Times decode = timed([&] {
             DroppedPlanes dropped;
             if (!readerOf(file)->readPlanes(decodeDenominator(size, wanted), dropped))
                 fail(file);
         });
-        ratios.push_back(timed(open) / decode);
+        ratios.push_back(timed(open).thread / decode.thread);
     }
-    std::sort(ratios.begin(), ratios.end());
-    std::printf("%-36s median %6.2f, worst %6.2f\n", "opening and showing / scaled decode", ratios[3], ratios[6]);
+    tell("opening and showing / scaled decode", "", ratios);
 
     const auto ticks = [&](const char* what, const std::function<void()>& step) {
         const EditFields before = edit;
         std::vector<double> times;
         for (int i = 0; i < 85; ++i)
             times.push_back(timed([&] {
-                step();
-                if (preview->render(edit, frame, scale).isNull())
-                    fail("not drawn");
-            }));
-        tell(what, times);
+                                step();
+                                if (preview->render(edit, frame, scale).isNull())
+                                    fail("not drawn");
+                            }).thread);
+        tell(what, " ms", times);
         edit = before;
     };
     ticks("zoom in, upright", [&] { edit.ZoomPercent = EditStep::zoom(edit.ZoomPercent, 2); });

@@ -2,6 +2,7 @@
 // order to render, one after another on one thread, in the same run; and the memory that an order of many pictures
 // takes.
 
+#include "Timing.h"
 #include "assembly/B3.h"
 #include "assembly/Form2.h"
 #include "assembly/PaperResize.h"
@@ -17,13 +18,11 @@
 #include "support/SamplePhotographs.h"
 #include "support/TestPlatform.h"
 
-#include <QElapsedTimer>
 #include <QFile>
 #include <QGuiApplication>
 
 #include <algorithm>
 #include <cstdio>
-#include <ctime>
 
 using namespace lumora;
 
@@ -36,22 +35,6 @@ class OtherPage : public Page {
 public:
     using Page::Page;
 };
-
-// Wall clock and processor time of all threads, in milliseconds.
-struct Times {
-    double wall = 0;
-    double processor = 0;
-};
-
-template <class Work>
-Times timed(Work work) {
-    QElapsedTimer wall;
-    wall.start();
-    const std::clock_t before = std::clock();
-    work();
-    return {static_cast<double>(wall.nsecsElapsed()) / 1e6,
-            1000.0 * static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC};
-}
 
 // A field of /proc/self/status in MiB: "VmRSS:", what the process holds now; "VmHWM:", the most it ever held.
 double memory(const char* field) {
@@ -107,8 +90,9 @@ class Bench {
 public:
     explicit Bench(Kind kind)
         : m_kind(kind)
-        , m_platform{m_machine.files, m_machine.dialogs, m_machine.noInternet, m_machine.shell, m_machine.clock,
-                     m_pump,          m_machine.volume, m_machine.instances}
+        , m_platform{m_machine.files, m_machine.dialogs, m_machine.noInternet,
+                     m_machine.mail,  m_machine.shell,   m_machine.clock,
+                     m_pump,          m_machine.volume,  m_machine.instances}
         , m_chain(m_pump) {
         const HostPath folder = makeFolder("C:\\pics");
         makeFolder("C:\\vedron");
@@ -226,11 +210,6 @@ private:
     int m_number = 100;
 };
 
-double median(std::vector<double> values) {
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
-}
-
 int ratio(Kind kind, int pictures, int rounds) {
     const char* work = kind == Kind::Plain ? "scaling" : "rendering";
     Bench bench(kind);
@@ -251,7 +230,7 @@ int ratio(Kind kind, int pictures, int rounds) {
             pictures, work, alone.wall, alone.processor, order.wall, order.processor, ratios.back());
         std::fflush(stdout);
     }
-    std::printf("median ratio %.2f\n", median(ratios));
+    std::printf("median ratio %.2f\n", spreadOf(ratios).median);
     return 0;
 }
 

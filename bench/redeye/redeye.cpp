@@ -2,6 +2,7 @@
 // beside the same rule on a copy of the whole picture with an overview scaled anew, which is how it is done where
 // pictures are values.
 
+#include "Timing.h"
 #include "common/HostFile.h"
 #include "editing/RedI.h"
 #include "session/PageChain.h"
@@ -15,7 +16,6 @@
 #include <algorithm>
 #include <chrono>
 #include <cstdio>
-#include <ctime>
 #include <filesystem>
 #include <thread>
 #include <vector>
@@ -27,23 +27,14 @@ namespace {
 constexpr PictureSize fiftyMegapixels{8660, 5773};
 constexpr int circle = 60;
 
-// Of all threads, in milliseconds.
-double processorTime() {
-    return 1000.0 * static_cast<double>(std::clock()) / CLOCKS_PER_SEC;
-}
-
-double wallTime() {
-    return std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now().time_since_epoch()).count();
-}
-
 QPoint eye(int round) {
     return {500 + round * 137 % (fiftyMegapixels.width - 1000), 400 + round * 211 % (fiftyMegapixels.height - 800)};
 }
 
-void print(const char* what, std::vector<double> times) {
-    std::sort(times.begin(), times.end());
-    std::printf("%-58s median %8.2f ms   lowest %8.2f   highest %8.2f\n", what, times[times.size() / 2], times.front(),
-                times.back());
+void print(const char* what, const std::vector<double>& times) {
+    const Spread spread = spreadOf(times);
+    std::printf("%-58s median %8.2f ms   lowest %8.2f   highest %8.2f\n", what, spread.median, spread.lowest,
+                spread.highest);
 }
 
 } // namespace
@@ -72,15 +63,13 @@ int main(int argc, char** argv) {
     }
 
     auto& page = static_cast<RedI&>(chain.load(PageId::RedI));
-    double processor = processorTime();
-    double wall = wallTime();
-    page.open(QStringLiteral("C:\\large.jpg"));
+    const Times opening = timed([&] { page.open(QStringLiteral("C:\\large.jpg")); });
     if (page.Picture1.isNull())
         return 1;
-    std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", wallTime() - wall, processorTime() - processor);
-    processor = processorTime();
-    std::this_thread::sleep_for(std::chrono::seconds(5)); // the customer looks for the eye
-    std::printf("the undo copy in the background: processor %.0f ms\n", processorTime() - processor);
+    std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", opening.wall, opening.processor);
+    // The customer looks for the eye.
+    const Times background = timed([] { std::this_thread::sleep_for(std::chrono::seconds(5)); });
+    std::printf("the undo copy in the background: processor %.0f ms\n", background.processor);
 
     std::vector<double> ours;
     std::vector<double> oursWall;
@@ -92,26 +81,25 @@ int main(int argc, char** argv) {
         page.Picture1_MouseUp(at);
         while (page.circle().width() != circle)
             page.Combo1_Change(page.circle().width() < circle ? 0 : 2);
-        processor = processorTime();
-        wall = wallTime();
-        page.Image2_Click();
-        ours.push_back(processorTime() - processor);
-        oursWall.push_back(wallTime() - wall);
+        const Times press = timed([&] { page.Image2_Click(); });
+        ours.push_back(press.processor);
+        oursWall.push_back(press.wall);
         if (page.List1.isEmpty()) {
             std::fprintf(stderr, "nothing was corrected\n");
             return 1;
         }
-        processor = processorTime();
-        page.Image7_Click();
-        undo.push_back(processorTime() - processor);
+        undo.push_back(timed([&] { page.Image7_Click(); }).processor);
 
-        processor = processorTime();
-        Bitmap copy(page.Picture1.image().copy());
-        const RedEye::Peak peak = RedEye::findPeak(copy, at);
-        const auto changed = RedEye::correct(copy, page.circle(), peak.ratio(), 0);
-        const QImage overview =
-            copy.image().scaled(page.Picture3.image().size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
-        copied.push_back(processorTime() - processor);
+        QStringList changed;
+        QImage overview;
+        const Times onCopy = timed([&] {
+            Bitmap copy(page.Picture1.image().copy());
+            const RedEye::Peak peak = RedEye::findPeak(copy, at);
+            changed = RedEye::correct(copy, page.circle(), peak.ratio(), 0);
+            overview =
+                copy.image().scaled(page.Picture3.image().size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+        });
+        copied.push_back(onCopy.processor);
         if (changed.isEmpty() || overview.isNull())
             return 1;
     }
