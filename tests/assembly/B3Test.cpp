@@ -52,20 +52,20 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EditFields fields;
     UnpackEditState(edits, fields);
     EditedPrint request;
-    request.file = *machine.drives.toHost(portrait);
+    request.file = host(portrait);
     request.paper = {10, 15};
     EXPECT_EQ(content->picture, *renderEditedPrintToJpeg(request, fields));
 
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{450, 580}));
+    EXPECT_EQ(*readPictureSize(host(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{450, 580}));
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(jobFolder + u"\\12~תמונה 01.bmp"_s)), (PictureSize{300, 450}));
+    EXPECT_EQ(*readPictureSize(host(jobFolder + u"\\12~תמונה 01.bmp"_s)), (PictureSize{300, 450}));
     EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_s)) << "goes at the end of each step";
     EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
     EXPECT_EQ(state.transfer.OrderLogBase + u".txt"_s, logPath());
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
-    const Result<OrderFindings> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
+    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
     ASSERT_TRUE(report);
     EXPECT_EQ(report->faults, QStringList());
     EXPECT_EQ(report->prints, 2);
@@ -108,7 +108,7 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     expectColour(print(5), middle, {grey(first).red(), grey(first).green(), grey(first).blue() / 2});
 
     // The last picture's copy; the corrected picture's is found under its own name too.
-    const auto copyOf = [this](const QString& path) { return loadPicture(*machine.drives.toHost(path)); };
+    const auto copyOf = [this](const QString& path) { return loadPicture(host(path)); };
     ASSERT_TRUE(copyOf(bw));
     EXPECT_EQ(copyOf(bw)->width(), 40) << "the size of the picture";
     expectColour(copyOf(bw)->image(), {20, 15}, grey(first));
@@ -179,7 +179,7 @@ TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
     const Changes turnedRed = {{EditRecord::GainR, u"0"_s}};
     prepare({edited(red), edited(green), edited(upright, record(turnedRed))});
     EXPECT_EQ(printFiles().size(), 3);
-    const QImage sheet = loadPicture(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s))->image();
+    const QImage sheet = loadPicture(host(folder() + u"\\!105_1234.jpp"_s))->image();
     // Cells lie every 82 pixels from 5, the first row at 161; a thumbnail is 80 wide and 53 high, also an upright one.
     expectColour(sheet, {5 + 40, 161 + 26}, Qt::green);
     expectColour(sheet, {87 + 76, 161 + 26}, Qt::black);
@@ -209,14 +209,14 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
         state.handOver.notice.clear();
         machine.dialogs.messages.clear();
         if (c.hasUploadForm)
-            chain.registerPage(PageId::UploadForm, [] { return std::make_unique<OtherPage>(PageId::UploadForm); });
+            registerBare({PageId::UploadForm});
         prepare({picture});
         QStringList wanted;
         for (const QString& name : c.sheets)
             wanted += name.arg(number);
         const QString place = folder(state.MisparHazmana);
         EXPECT_EQ(machine.files.names(place, u"!*"_s), wanted) << number;
-        EXPECT_EQ(checkOrderFolder(*machine.drives.toHost(place), {56, 30})->faults, QStringList());
+        EXPECT_EQ(checkOrderFolder(host(place), {56, 30})->faults, QStringList());
         EXPECT_EQ(front(), c.front) << number;
         EXPECT_EQ(state.handOver.notice.contains(state.MisparHazmana), c.notice) << number;
         EXPECT_EQ(machine.dialogs.messages.size(), c.notice && !c.local ? 1 : 0) << "no page to go on with";
@@ -261,7 +261,7 @@ TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     EXPECT_LT(printFiles().size(), 5);
     EXPECT_FALSE(exists(logPath()));
     EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_s)) << "an abandoned order burns no number";
-    for (const auto& entry : std::filesystem::directory_iterator(*machine.drives.toHost(u"C:\\2000lumora"_s)))
+    for (const auto& entry : std::filesystem::directory_iterator(host(u"C:\\2000lumora"_s)))
         EXPECT_TRUE(entry.is_directory() || entry.path().filename() == "bw.bmp") << entry.path();
 }
 
@@ -273,7 +273,7 @@ TEST_F(PreparingAnEditedOrder, keepsWhatWasPreparedWhenTheLogCanNotBeWritten) {
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"KUP_1234^105.txt"_s));
     EXPECT_EQ(front(), PageId::B3);
     EXPECT_EQ(printFiles().size(), 1);
-    std::filesystem::remove(*machine.drives.toHost(logPath()));
+    std::filesystem::remove(host(logPath()));
     page.Command5_Click();
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the same number at the next press";
@@ -289,8 +289,8 @@ TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
     const SmallDisk disk(1600);
     if (!disk.available())
         GTEST_SKIP() << "this user may not mount a small disk";
-    std::filesystem::remove_all(*machine.drives.toHost(u"C:\\2000lumora"_s));
-    std::filesystem::create_directory_symlink(disk.path(), *machine.drives.toHost(u"C:\\2000lumora"_s));
+    std::filesystem::remove_all(host(u"C:\\2000lumora"_s));
+    std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\2000lumora"_s));
     makeFolder(u"C:\\2000lumora\\zmany"_s);
     const QStringList failed = prepare(items);
     ASSERT_FALSE(machine.dialogs.messages.isEmpty());

@@ -35,9 +35,8 @@ class PreparingAnEditedOrder : public PreparingAPlainOrder {
 protected:
     PreparingAnEditedOrder() {
         state.Optint = 2;
-        chain.registerPage(PageId::B3, [this] { return std::make_unique<B3>(state, machine.platform, chain); });
-        chain.registerPage(PageId::gdisave,
-                           [this] { return std::make_unique<gdisave>(state, machine.platform, chain); });
+        registerPage<B3>(PageId::B3);
+        registerPage<gdisave>(PageId::gdisave);
         for (const char* path : {"C:\\2000lumora", "C:\\2000lumora\\zmany", "C:\\2000lumora\\zmany\\tempred"})
             makeFolder(QString::fromLatin1(path));
     }
@@ -64,7 +63,7 @@ protected:
     static QString correctedPath(const QString& path) {
         return u"C:\\2000lumora\\zmany\\tempred\\"_s + MangleFileName(path);
     }
-    QString hostText(const QString& path) const { return toText(*machine.drives.toHost(path)); }
+    QString hostText(const QString& path) const { return toText(host(path)); }
     bool exists(const QString& path) const { return machine.files.fileExists(path); }
 
     // The picture inside the print file of that place in the list.

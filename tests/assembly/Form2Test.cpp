@@ -36,11 +36,11 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
                            u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s}));
     const Result<PrintFileContent> print = unpacked(u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s);
     ASSERT_TRUE(print);
-    EXPECT_EQ(print->picture, *resizeToPaper(*machine.drives.toHost(portrait), {10, 15}));
+    EXPECT_EQ(print->picture, *resizeToPaper(host(portrait), {10, 15}));
     EXPECT_EQ(print->tail, "1 1 03-1234567Dana Levi 13 1051234      ");
     ASSERT_TRUE(giveFile(u"print.jpg"_s, print->picture).size() > 0);
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(u"C:\\pics\\print.jpg"_s)), (PictureSize{1200, 1600}));
-    EXPECT_EQ(*readPictureSize(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{500, 480}));
+    EXPECT_EQ(*readPictureSize(host(u"C:\\pics\\print.jpg"_s)), (PictureSize{1200, 1600}));
+    EXPECT_EQ(*readPictureSize(host(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{500, 480}));
 
     EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the number in memory stays this order's";
@@ -212,7 +212,7 @@ TEST_F(PreparingAPlainOrder, keepsTheOrderAtALocalStationAndTellsItsNumberOnTheS
 }
 
 TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) {
-    chain.registerPage(PageId::MoogMeret, [] { return std::make_unique<Page>(PageId::MoogMeret); });
+    registerBare({PageId::MoogMeret});
     state.TmunatPaar = 1;
     state.Optint = 3;
     openWith({line(givePicture(u"one.jpg"_s))}).Command6_Click();
@@ -244,7 +244,7 @@ TEST_F(PreparingAPlainOrder, goesOnWithoutTheCounterButNotWithoutTheLog) {
     EXPECT_EQ(front(), PageId::Form2);
     EXPECT_EQ(printFiles().size(), 2) << "what was prepared is kept";
 
-    std::filesystem::remove(*machine.drives.toHost(logPath()));
+    std::filesystem::remove(host(logPath()));
     page.Command3_Click();
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the same number at the next press";
@@ -348,7 +348,7 @@ TEST_F(PreparingAnAlbum, writesTheLogThatTheLabExpectsToTheByte) {
 
 TEST_F(PreparingAnAlbum, drawsItsOwnSheetWithTheContactSheetBelow) {
     openWith({albumLine(givePicture(u"one.jpg"_s))}).Command6_Click();
-    const Result<Bitmap> sheet = loadPicture(*machine.drives.toHost(folder() + u"\\!105_1234.jpp"_s));
+    const Result<Bitmap> sheet = loadPicture(host(folder() + u"\\!105_1234.jpp"_s));
     ASSERT_TRUE(sheet);
     const auto near = [&](QPoint at, QColor wanted) {
         const QColor found = sheet->image().pixelColor(at);
@@ -370,10 +370,10 @@ TEST_F(PreparingAnAlbum, sizesItsPicturesToTheAlbumUnlessTheyAreCompressedDeeply
         const Result<PrintFileContent> print = unpacked(u"1 3060MNB0000_106F6E65.jpp"_s);
         ASSERT_TRUE(print);
         giveFile(u"print.jpg"_s, print->picture);
-        EXPECT_EQ(*readPictureSize(*machine.drives.toHost(u"C:\\pics\\print.jpg"_s)),
+        EXPECT_EQ(*readPictureSize(host(u"C:\\pics\\print.jpg"_s)),
                   deep == 1 ? (PictureSize{960, 640}) : (PictureSize{480, 320}));
         EXPECT_EQ(print->tail, "1 1                     1  1051234      ") << "the customer's fields are empty";
-        std::filesystem::remove_all(*machine.drives.toHost(folder()));
+        std::filesystem::remove_all(host(folder()));
         chain.unload(PageId::FtpFrm);
         state.MisparHazmana = u"105"_s;
     }
@@ -388,8 +388,7 @@ TEST_F(PreparingAnAlbum, holdsTogetherForWhoReadsTheFolder) {
             .Command6_Click();
         EXPECT_TRUE(machine.files.read(logPath(number))->contains("KUP_1234^105\"")) << "never with the P";
         chain.unload(PageId::FtpFrm);
-        const Result<OrderFindings> report =
-            checkOrderFolder(*machine.drives.toHost(folder(number)), PrintFileShape::of(state.profile));
+        const Result<OrderFindings> report = checkOrderFolder(host(folder(number)), PrintFileShape::of(state.profile));
         ASSERT_TRUE(report);
         EXPECT_EQ(report->faults.join(u'|'), QString());
         EXPECT_EQ(report->copies, 3);

@@ -23,7 +23,7 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
     ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &before), 0);
     {
         const SmallDisk disk(200);
-        std::filesystem::create_directory_symlink(disk.path(), *machine.drives.toHost(u"C:\\2000lumora"_s));
+        std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\2000lumora"_s));
         if (!disk.available()) {
             std::signal(SIGXFSZ, SIG_IGN);
             const rlimit limit{20000, before.rlim_max};

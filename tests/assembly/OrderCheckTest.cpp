@@ -17,8 +17,7 @@ protected:
     }
 
     QStringList faults() const {
-        const Result<OrderFindings> report =
-            checkOrderFolder(*machine.drives.toHost(folder()), PrintFileShape::of(state.profile));
+        const Result<OrderFindings> report = checkOrderFolder(host(folder()), PrintFileShape::of(state.profile));
         return report ? report->faults : QStringList(report.failure().message);
     }
     // The faults after a change to a file of the folder; the file is put back.
@@ -38,7 +37,7 @@ protected:
 };
 
 TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
-    const Result<OrderFindings> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
+    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
     ASSERT_TRUE(report);
     EXPECT_EQ(report->faults, QStringList());
     EXPECT_EQ(report->order, u"2026_11_21_KUP_1234^105"_s);

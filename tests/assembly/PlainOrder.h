@@ -3,21 +3,14 @@
 #include "assembly/Form2.h"
 #include "assembly/PrintFile.h"
 #include "imaging/PictureFile.h"
-#include "session/PageChain.h"
 #include "support/ExampleOrder.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-// A page that is only shown.
-class OtherPage : public Page {
-public:
-    using Page::Page;
-};
 
 // A picture with so much noise that its file is large for its size.
 inline Bitmap noisyPicture(int width, int height, unsigned seed) {
@@ -31,25 +24,21 @@ inline Bitmap noisyPicture(int width, int height, unsigned seed) {
     return picture;
 }
 
-class PreparingAPlainOrder : public ::testing::Test {
+class PreparingAPlainOrder : public ::testing::Test, protected PageRig {
 protected:
-    PreparingAPlainOrder()
-        : state(exampleOrder())
-        , chain(machine.pump) {
+    PreparingAPlainOrder() {
+        state = exampleOrder();
         state.DiskRoot = machine.drives.programRoot();
         state.Optint = 1;
         state.shemot.TotalPics = 0;
         state.profile.JppBase = 30;
         state.profile.JppChunks = 56;
         state.transfer.SugMishloah = 1;
-        for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
-            chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });
-        chain.registerPage(PageId::Form2, [this] { return std::make_unique<Form2>(state, machine.platform, chain); });
+        registerBare({PageId::hatchala, PageId::FtpFrm});
+        registerPage<Form2>(PageId::Form2);
         makeFolder(u"C:\\vedron"_s);
         makeFolder(u"C:\\pics"_s);
     }
-
-    void makeFolder(const QString& path) { std::filesystem::create_directories(*machine.drives.toHost(path)); }
 
     QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
         const QString path = u"C:\\pics\\"_s + name;
@@ -88,10 +77,6 @@ protected:
                      : Result<PrintFileContent>(bytes.failure());
     }
     PageId front() const { return chain.front()->id(); }
-
-    TestPlatform machine;
-    SessionState state;
-    PageChain chain;
 };
 
 } // namespace lumora

@@ -71,7 +71,7 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
     ASSERT_EQ(prepare(items), QStringList());
     const QMap<int, QByteArray> first = packed();
     ASSERT_EQ(first.size(), 12);
-    const Result<OrderFindings> report = checkOrderFolder(*machine.drives.toHost(folder()), {56, 30});
+    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
     ASSERT_TRUE(report);
     EXPECT_EQ(report->faults.join(u'\n').toStdString(), "");
     const Result<QByteArray> log = machine.files.read(logPath());

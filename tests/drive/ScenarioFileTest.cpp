@@ -4,6 +4,8 @@
 
 using namespace lumora;
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 ScenarioCommand only(const char* line) {

@@ -1,9 +1,7 @@
 #include "editing/BigPics.h"
 #include "editing/Form3.h"
 #include "imaging/PictureFile.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
@@ -58,25 +56,18 @@ TEST(SampleColorLevels, GivesTopLevelsGainsAndFloorsOfAFlatPicture) {
     }
 }
 
-class WorkSurfaces : public ::testing::Test {
+class WorkSurfaces : public ::testing::Test, protected PageRig {
 protected:
-    WorkSurfaces()
-        : chain(machine.pump) {
-        state.DiskRoot = machine.drives.programRoot();
-        chain.registerPage(PageId::Form3, [this] { return std::make_unique<Form3>(state, machine.platform, chain); });
-    }
+    WorkSurfaces() { registerPage<Form3>(PageId::Form3); }
     QString picture(const char* name, const Bitmap& bitmap) {
         const QString path = u"C:\\"_s + QString::fromLatin1(name);
-        EXPECT_TRUE(bitmap.image().save(toText(*machine.drives.toHost(path)), "BMP"));
+        EXPECT_TRUE(bitmap.image().save(toText(host(path)), "BMP"));
         return path;
     }
     EditedPreview opened(const QString& path) {
-        return *EditedPreview::open(*machine.drives.toHost(path), {10, 15}, 100, EditedPreview::Tone::Colour);
+        return *EditedPreview::open(host(path), {10, 15}, 100, EditedPreview::Tone::Colour);
     }
 
-    TestPlatform machine;
-    SessionState state;
-    PageChain chain;
     BigPics surfaces;
 };
 
@@ -136,7 +127,7 @@ TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
             << c.angle;
         look.Command1_Click();
     }
-    std::filesystem::remove(*machine.drives.toHost(path));
+    std::filesystem::remove(host(path));
     look.Command2_Click();
     EXPECT_TRUE(look.Picture2.isNull());
     ASSERT_EQ(machine.dialogs.messages.size(), 1);

@@ -125,33 +125,20 @@ TEST(PaintLineFrame, PutsTheInkOfEachStyleWhereItsTableSays) {
     };
     constexpr double whole = 250;
     const auto blended = [](int alpha) { return static_cast<int>(whole * alpha / 255); };
-    for (const Case& c : {
-             // Thin rectangles, one a pixel, from 255 down by 2 or 3 a step.
-             Case{"W03", 0, 150, 250},
-             Case{"W03", 10, 150, blended(235)},
-             Case{"W03", 100, 150, blended(55)},
-             Case{"W03", 140, 150, 0},
-             Case{"W13", 10, 150, blended(225)},
-             Case{"W13", 90, 150, 0},
-             Case{"W17", 22, 150, blended(205 - 66)},
-             Case{"W17", 23, 150, 0},
-             // The ellipse that touches the edges, growing outwards: the middle of an edge, and nothing inside.
-             Case{"W04", 225, 30, 0},
-             Case{"W14", 225, 150, 0},
-             Case{"W16", 225, 150, 0},
-             // An edge whose pen lies half outside.
-             Case{"W21", 9, 150, blended(211)},
-             Case{"W21", 11, 150, 0},
-             Case{"W22", 9, 150, blended(155)},
-             Case{"W29", 29, 150, blended(211)},
-             Case{"W29", 31, 150, 0},
-             // A second line of 12 around half the first width.
-             Case{"W31", 15, 150, blended(200)},
-             Case{"W31", 17, 150, 0},
-             // The innermost line of the glow.
-             Case{"W41", 20, 150, blended(183)},
-             Case{"W41", 22, 150, 0},
-         })
+    for (const Case& c :
+         {// Thin rectangles, one a pixel, from 255 down by 2 or 3 a step.
+          Case{"W03", 0, 150, 250}, Case{"W03", 10, 150, blended(235)}, Case{"W03", 100, 150, blended(55)},
+          Case{"W03", 140, 150, 0}, Case{"W13", 10, 150, blended(225)}, Case{"W13", 90, 150, 0},
+          Case{"W17", 22, 150, blended(205 - 66)}, Case{"W17", 23, 150, 0},
+          // The ellipse that touches the edges, growing outwards: the middle of an edge, and nothing inside.
+          Case{"W04", 225, 30, 0}, Case{"W14", 225, 150, 0}, Case{"W16", 225, 150, 0},
+          // An edge whose pen lies half outside.
+          Case{"W21", 9, 150, blended(211)}, Case{"W21", 11, 150, 0}, Case{"W22", 9, 150, blended(155)},
+          Case{"W29", 29, 150, blended(211)}, Case{"W29", 31, 150, 0},
+          // A second line of 12 around half the first width.
+          Case{"W31", 15, 150, blended(200)}, Case{"W31", 17, 150, 0},
+          // The innermost line of the glow.
+          Case{"W41", 20, 150, blended(183)}, Case{"W41", 22, 150, 0}})
         EXPECT_NEAR(ink(lineFrame(QString::fromLatin1(c.code)), c.x, c.y), c.ink, 2)
             << c.code << " at " << c.x << ", " << c.y;
 }

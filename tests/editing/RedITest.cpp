@@ -5,16 +5,13 @@
 #include "editing/RedEye.h"
 #include "editing/RedOverview.h"
 #include "editing/tFrmNew.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
 #include <QPainter>
 
 #include <fstream>
-#include <memory>
 
 namespace lumora {
 namespace {
@@ -30,16 +27,13 @@ const QString correctedCopy = u"C:\\2000lumora\\zmany\\tempred\\C;]pics]eyes.jpg
 constexpr QPoint leftEye{60, 50};
 constexpr QPoint rightEye{140, 50};
 
-class RedEyePage : public ::testing::Test {
+class RedEyePage : public ::testing::Test, protected PageRig {
 protected:
-    RedEyePage()
-        : chain(machine.pump) {
-        state.DiskRoot = machine.drives.programRoot();
-        chain.registerPage(PageId::tFrmNew,
-                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+    RedEyePage() {
+        registerPage<tFrmNew>(PageId::tFrmNew);
+        registerPage<RedI>(PageId::RedI);
         chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
-        chain.registerPage(PageId::RedI, [this] { return std::make_unique<RedI>(state, machine.platform, chain); });
-        std::filesystem::create_directories(machine.drives.dataFolder() / "pics");
+        makeFolder(u"C:\\pics"_s);
         Bitmap face(200, 150, QColor::fromRgb(skin));
         QPainter painter(&face.image());
         for (const QPoint eye : {leftEye, rightEye, QPoint(1, 1)})
@@ -52,11 +46,10 @@ protected:
     // Without loss, whatever the name's ending says.
     void save(const Bitmap& picture) {
         state.edit.PicturePath = u"C:\\pics\\eyes.jpg"_s;
-        ASSERT_TRUE(picture.image().save(host(state.edit.PicturePath), "PNG"));
+        ASSERT_TRUE(picture.image().save(toText(host(state.edit.PicturePath)), "PNG"));
         original = picture.image();
         customersFile = *machine.files.read(state.edit.PicturePath);
     }
-    QString host(const QString& path) const { return toText(*machine.drives.toHost(path)); }
 
     RedI& open() {
         auto& page = static_cast<RedI&>(chain.load(PageId::RedI));
@@ -82,13 +75,10 @@ protected:
     }
     static bool isGrey(QRgb pixel) { return qRed(pixel) == qGreen(pixel) && qGreen(pixel) == qBlue(pixel); }
     QImage pictureIn(const QString& path) const {
-        const Result<Bitmap> picture = loadPicture(*machine.drives.toHost(path));
+        const Result<Bitmap> picture = loadPicture(host(path));
         return picture ? picture->image().convertToFormat(QImage::Format_RGB32) : QImage();
     }
 
-    TestPlatform machine;
-    SessionState state;
-    PageChain chain;
     QImage original;
     QByteArray customersFile;
 };
@@ -205,7 +195,7 @@ TEST_F(RedEyePage, MarksThePictureOnlyWhenTheSaveSucceeded) {
     correctAt(page, leftEye);
     const QImage corrected = page.Picture1.image();
     // A folder stands where the file belongs.
-    std::filesystem::create_directory(*machine.drives.toHost(correctedCopy));
+    std::filesystem::create_directory(host(correctedCopy));
     page.Image8_Click();
     ASSERT_TRUE(isOpen());
     EXPECT_EQ(state.edit.RedMarker, u"000"_s);
@@ -214,7 +204,7 @@ TEST_F(RedEyePage, MarksThePictureOnlyWhenTheSaveSucceeded) {
     EXPECT_EQ(page.Picture1.image(), corrected);
     EXPECT_FALSE(page.busy);
 
-    std::filesystem::remove(*machine.drives.toHost(correctedCopy));
+    std::filesystem::remove(host(correctedCopy));
     page.Image8_Click();
     EXPECT_EQ(state.edit.RedMarker, u"RED"_s);
     EXPECT_EQ(pictureIn(correctedCopy), corrected);
@@ -250,8 +240,8 @@ TEST_F(RedEyePage, KeepsThePictureBeforeTheLatestCorrectionAsItsUndoCopy) {
 }
 
 TEST_F(RedEyePage, NeverTakesBackToTheCopyOfAnotherVisit) {
-    std::filesystem::create_directories(machine.drives.toHost(undoCopy)->parent_path());
-    ASSERT_TRUE(QImage(200, 150, QImage::Format_RGB32).save(host(undoCopy), "BMP"));
+    std::filesystem::create_directories(host(undoCopy).parent_path());
+    ASSERT_TRUE(QImage(200, 150, QImage::Format_RGB32).save(toText(host(undoCopy)), "BMP"));
     const QByteArray others = *machine.files.read(undoCopy);
     RedI& page = open();
     EXPECT_FALSE(page.Image7.enabled);
@@ -269,14 +259,14 @@ TEST_F(RedEyePage, NeverTakesBackToTheCopyOfAnotherVisit) {
 TEST_F(RedEyePage, DoesNotCorrectWhatItCouldNotTakeBack) {
     RedI& page = open();
     pick(page, leftEye);
-    std::filesystem::remove_all(machine.drives.toHost(undoCopy)->parent_path());
-    std::ofstream(*machine.drives.toHost(u"C:\\2000lumora\\zmany\\tempred"_s)) << "in the way";
+    std::filesystem::remove_all(host(undoCopy).parent_path());
+    std::ofstream(host(u"C:\\2000lumora\\zmany\\tempred"_s)) << "in the way";
     page.Image2_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_EQ(page.Picture1.image(), original);
     EXPECT_FALSE(page.RedChanged);
     EXPECT_TRUE(page.Image2.enabled);
-    std::filesystem::remove(*machine.drives.toHost(u"C:\\2000lumora\\zmany\\tempred"_s));
+    std::filesystem::remove(host(u"C:\\2000lumora\\zmany\\tempred"_s));
     page.Image2_Click(); // the whole copy is written now, while the page waits
     EXPECT_FALSE(page.Label4Busy.visible);
     EXPECT_TRUE(page.Image2.enabled);
@@ -385,11 +375,15 @@ TEST_F(RedEyePage, MovesTheCircleAndThePictureUnderIt) {
     page.tickOnceIfNone(); // it has ticked by now
     page.Arrow_MouseUp();
     EXPECT_FALSE(page.Timer5.running());
+    page.Timer5_Tick(); // one that was under way
+    page.Image12_MouseDown();
     page.Timer2_Tick();
     EXPECT_EQ(QPoint(page.RedSearchX, page.RedSearchY), QPoint(62, 48));
     EXPECT_EQ(page.Picture1Left, 500 - 62 * page.Magnification); // it stays where it is in view
+    page.Image14_MouseDown();
     for (int tick = 0; tick < 100; ++tick)
         page.Timer4_Tick();
+    page.Arrow_MouseUp();
     EXPECT_EQ(page.RedSearchX, 0);
 
     const int size = page.circle().width();

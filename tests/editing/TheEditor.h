@@ -7,10 +7,8 @@
 #include "editing/mikledet.h"
 #include "editing/tFrmNew.h"
 #include "imaging/PictureFile.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
@@ -24,27 +22,22 @@ inline const QString lying = u"C:\\p\\lying.jpg"_s;
 inline const QString standing = u"C:\\p\\standing.jpg"_s;
 
 // The editor on a fresh drive with two red pictures. stored: the records that it gave away since a picture was opened.
-class TheEditor : public testing::Test {
+class TheEditor : public testing::Test, protected PageRig {
 protected:
-    TheEditor()
-        : chain(machine.pump) {
-        state.DiskRoot = u"C:\\"_s;
+    TheEditor() {
         state.Optint = 2;
         state.shemot.ppr = u"10/15"_s;
         state.shemot.Bord = u"NB"_s;
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
-        EXPECT_TRUE(machine.files.makeFolder(u"C:\\p"_s));
+        makeFolder(u"C:\\p"_s);
         savePicture(lying, {400, 300}, Qt::red);
         savePicture(standing, {300, 400}, Qt::red);
-        chain.registerPage(PageId::tFrmNew,
-                           [this] { return std::make_unique<tFrmNew>(state, machine.platform, chain); });
+        registerPage<tFrmNew>(PageId::tFrmNew);
+        registerPage<mikledet>(PageId::mikledet);
         chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
-        chain.registerPage(PageId::mikledet,
-                           [this] { return std::make_unique<mikledet>(state, machine.platform, chain); });
-        chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
+        registerBare({PageId::kyoskNew});
     }
 
-    HostPath host(const QString& path) const { return *machine.drives.toHost(path); }
     void savePicture(const QString& path, PictureSize size, QColor colour) {
         EXPECT_TRUE(saveJpeg(Bitmap(size.width, size.height, colour), host(path), 95));
     }
@@ -97,9 +90,6 @@ protected:
              [&] { page().Image2_MouseUp(index); }, ticks);
     }
 
-    TestPlatform machine;
-    SessionState state;
-    PageChain chain;
     QStringList stored;
 };
 

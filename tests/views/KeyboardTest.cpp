@@ -21,6 +21,11 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+void activate(Walk& walk) {
+    walk.program().window().activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
+}
+
 QString focusName() {
     return QApplication::focusWidget() ? QApplication::focusWidget()->objectName() : QString();
 }
@@ -42,34 +47,30 @@ void tabTo(Walk& walk, const QString& name) {
     ASSERT_EQ(focusName(), name);
 }
 
+void press(Walk& walk, const QString& name, Qt::Key code = Qt::Key_Return) {
+    tabTo(walk, name);
+    key(walk, code);
+}
+
 } // namespace
 
 TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     Walk walk({1024, 768});
-    walk.program().window().activateWindow();
-    ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
-    tabTo(walk, u"Image1"_s);
-    key(walk, Qt::Key_Space);
+    activate(walk);
+    press(walk, u"Image1"_s, Qt::Key_Space);
     walk.waitFor(u"nnn"_s);
-    tabTo(walk, u"Image1(0)"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Image1(0)"_s);
     ASSERT_EQ(focusName(), u"Text2"_s) << "the first box has the keyboard";
     text(u"Dana Levi"_s);
     key(walk, Qt::Key_Tab);
     text(u"03-1234567"_s);
     key(walk, Qt::Key_Return); // the main action
-    tabTo(walk, u"Option1(0)"_s);
-    key(walk, Qt::Key_Space);
-    tabTo(walk, u"Option3(1)"_s);
-    key(walk, Qt::Key_Return);
-    tabTo(walk, u"Image13(9)"_s);
-    key(walk, Qt::Key_Space);
-    tabTo(walk, u"Command6"_s);
-    key(walk, Qt::Key_Return);
-    tabTo(walk, u"Check1"_s);
-    key(walk, Qt::Key_Space);
-    tabTo(walk, u"Command3"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Option1(0)"_s, Qt::Key_Space);
+    press(walk, u"Option3(1)"_s);
+    press(walk, u"Image13(9)"_s, Qt::Key_Space);
+    press(walk, u"Command6"_s);
+    press(walk, u"Check1"_s, Qt::Key_Space);
+    press(walk, u"Command3"_s);
     walk.waitFor(u"kyoskNew"_s);
 
     // The picker runs an event loop of its own below the press.
@@ -80,14 +81,12 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
         picked = true;
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
     });
-    tabTo(walk, u"firstFolder"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"firstFolder"_s);
     ASSERT_TRUE(picked);
     walk.settle(300);
     auto& pictures = walk.page<kyoskNew>(PageId::kyoskNew);
     ASSERT_EQ(pictures.List4.count(), 14);
-    tabTo(walk, u"Picture1(0)"_s);
-    key(walk, Qt::Key_Space);
+    press(walk, u"Picture1(0)"_s, Qt::Key_Space);
     key(walk, Qt::Key_Down);
     key(walk, Qt::Key_Right);
     ASSERT_EQ(focusName(), u"Picture1(5)"_s);
@@ -95,16 +94,13 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     key(walk, Qt::Key_Plus);
     EXPECT_EQ(pictures.Label7.text.trimmed(), u"3"_s);
     EXPECT_EQ(pictures.List1.count(), 2);
-    tabTo(walk, u"Image10"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Image10"_s);
     ASSERT_TRUE(pictures.Frame3.visible);
     key(walk, Qt::Key_Escape);
     EXPECT_FALSE(pictures.Frame3.visible) << "Esc closes the panel";
-    tabTo(walk, u"Image7"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Image7"_s);
     ASSERT_TRUE(pictures.Frame4.visible);
-    tabTo(walk, u"Command7"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Command7"_s);
     walk.waitFor(u"FtpFrm"_s);
     EXPECT_EQ(walk.program().state().shemot.n1, u"Dana Levi"_s);
     EXPECT_EQ(walk.program().state().shemot.Bord, u"WB"_s);
@@ -112,49 +108,37 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
 
 TEST(Keyboard, PutsAnAlbumTogetherWithoutAMouse) {
     Walk walk({1024, 768});
-    walk.program().window().activateWindow();
-    ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
+    activate(walk);
     walk.press(u"hatchala"_s, u"Image1"_s);
     walk.waitFor(u"nnn"_s);
-    tabTo(walk, u"Image1(6)"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Image1(6)"_s);
     ASSERT_EQ(focusName(), u"Text1(0)"_s) << "the first box has the keyboard";
     text(u"Studio Or"_s);
     key(walk, Qt::Key_Return); // the main action
     ASSERT_EQ(focusName(), u"SoogAlb(0)"_s);
     key(walk, Qt::Key_Tab);
     key(walk, Qt::Key_Space);
-    tabTo(walk, u"Check4"_s);
-    key(walk, Qt::Key_Space);
-    tabTo(walk, u"Combo4Horim"_s);
-    key(walk, Qt::Key_Down);
-    tabTo(walk, u"Command16"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Check4"_s, Qt::Key_Space);
+    press(walk, u"Combo4Horim"_s, Qt::Key_Down);
+    press(walk, u"Command16"_s);
     ASSERT_EQ(focusName(), u"Combo4Godel(0)"_s);
-    tabTo(walk, u"Combo4Godel(2)"_s);
-    key(walk, Qt::Key_Space);
+    press(walk, u"Combo4Godel(2)"_s, Qt::Key_Space);
     EXPECT_EQ(focusName(), u"Combo4Godel(2)"_s) << "a card that is taken keeps the keyboard";
     for (const auto& [next, card] : {std::pair{u"Command18"_s, u"Combo4Cricha(1)"_s},
                                      {u"Command19"_s, u"Combo4Niyar(0)"_s},
                                      {u"Command20"_s, u"Combo4Tosefet(3)"_s}}) {
-        tabTo(walk, next);
-        key(walk, Qt::Key_Return);
-        tabTo(walk, card);
-        key(walk, Qt::Key_Return);
+        press(walk, next);
+        press(walk, card);
     }
-    tabTo(walk, u"Check3(5)"_s);
-    key(walk, Qt::Key_Space);
+    press(walk, u"Check3(5)"_s, Qt::Key_Space);
     key(walk, Qt::Key_Escape);
     const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album;
     EXPECT_EQ(album.panel, AlbumPanels::Panel::Paper) << "Esc goes one panel back";
-    tabTo(walk, u"Command20"_s);
-    key(walk, Qt::Key_Return);
-    tabTo(walk, u"Command21"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Command20"_s);
+    press(walk, u"Command21"_s);
     ASSERT_EQ(focusName(), u"Check6"_s);
     key(walk, Qt::Key_Space);
-    tabTo(walk, u"Command22"_s);
-    key(walk, Qt::Key_Return);
+    press(walk, u"Command22"_s);
     // The telephone is missing: its box is where the keyboard is once the message is read.
     EXPECT_EQ(walk.program().dialogs().shownTexts, QStringList{u"לא כתבתה מספר טלפון"_s});
     key(walk, Qt::Key_Return);

@@ -122,27 +122,6 @@ TEST_F(FtpTest, SendsHebrewNamesAsBytesOfTheCodePageAndReadsThemBack) {
     EXPECT_EQ(names(*ftp->list(u"*.*"_s)), (std::vector<std::string>{"שלום.txt"}));
 }
 
-TEST_F(FtpTest, ListsOddNamesAsTheyAre) {
-    const std::vector<std::string> odd = {
-        "five     blanks", "  leading", "trailing ", "1 2 Nov 21 03:47 x", "total 12", "a -> b", "[x]",
-        "no_ending",       "#1%20"};
-    for (const std::string& name : odd) {
-        std::ofstream(lab.ordersFolder() / name) << "x";
-        fs::permissions(lab.ordersFolder() / name, fs::perms::all);
-    }
-    fs::create_directory(lab.ordersFolder() / "sub folder");
-    auto ftp = connect(lab.ftpHost());
-    ASSERT_TRUE(ftp);
-    const auto entries = ftp->list(u"*.*"_s);
-    ASSERT_TRUE(entries) << entries.failure().message.toStdString();
-    std::vector<std::string> expected = odd;
-    expected.push_back("sub folder");
-    std::sort(expected.begin(), expected.end());
-    EXPECT_EQ(names(*entries), expected);
-    for (const FtpEntry& entry : *entries)
-        EXPECT_EQ(entry.folder, entry.name == u"sub folder"_s) << entry.name.toStdString();
-}
-
 TEST_F(FtpTest, RefusesANameWithALineBreakBeforeAnythingIsSent) {
     TcpRelay relay(lab.ftpPort());
     auto ftp = connect(relay.host());

@@ -1,0 +1,33 @@
+#pragma once
+
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <initializer_list>
+#include <memory>
+
+namespace lumora {
+
+// What the test of a page stands on: a fresh machine, the session, and the chain with the pages that the test names.
+struct PageRig {
+    PageRig() { state.DiskRoot = machine.drives.programRoot(); }
+
+    template <class P>
+    void registerPage(PageId id) {
+        chain.registerPage(id, [this] { return std::make_unique<P>(state, machine.platform, chain); });
+    }
+    // Pages that are only shown.
+    void registerBare(std::initializer_list<PageId> ids) {
+        for (const PageId id : ids)
+            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
+    }
+    void makeFolder(const QString& path) { std::filesystem::create_directories(host(path)); }
+    HostPath host(const QString& path) const { return *machine.drives.toHost(path); }
+
+    TestPlatform machine;
+    SessionState state;
+    PageChain chain{machine.pump};
+};
+
+} // namespace lumora
