@@ -141,7 +141,7 @@ void UploadForm::enter(Phase phase) {
     done = phase == Phase::Success || phase == Phase::AllThere;
     failed = phase == Phase::NotAll || phase == Phase::NoOrder || phase == Phase::NoServer;
     Command10.visible = phase == Phase::Stopped;
-    Command3.visible = phase == Phase::Countdown;
+    Command3.visible = phase == Phase::Countdown || phase == Phase::Verifying || phase == Phase::NotAll;
     showWhatToDo();
     Q_EMIT changed();
 }

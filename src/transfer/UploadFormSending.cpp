@@ -54,7 +54,7 @@ void UploadForm::HttpAttempts() {
         Label1.text =
             m_state.wording(QStringLiteral("לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה"),
                             QStringLiteral("After three attempts the computer could not upload the whole order"));
-        Image5.visible = Command3.visible = true;
+        Image5.visible = true;
         enter(Phase::NotAll);
         return;
     }
@@ -121,7 +121,6 @@ void UploadForm::HttpSendFiles(int listNumber) {
     }
     Label4File.text.clear();
     enter(Phase::Verifying);
-    Command3.visible = true;
     if (CheckOrderOnServer(listNumber) != ServerVerdict::Listed)
         takeAllAsMissing();
     showMissingCount();

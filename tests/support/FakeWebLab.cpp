@@ -44,6 +44,8 @@ Result<QByteArray> FakeWebLab::fetch(const QString& url) {
         return down();
     if (!url.contains(QStringLiteral("listfileb.php"))) {
         reports += url;
+        if (strikes(deadReports))
+            return down();
         return QByteArray("OK");
     }
     const QString folder = url.mid(url.indexOf(QStringLiteral("tik=")) + 4);

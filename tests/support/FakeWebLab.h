@@ -17,6 +17,7 @@ public:
 
     int deadPosts = 0;                     // posts that reach nobody; always is for good
     int deadCalls = 0;                     // the same of fetches and downloads
+    int deadReports = 0;                   // the same of calls that are no list
     std::map<QString, int> losses;         // how often a file is accepted and not stored
     std::optional<QByteArray> listInstead; // what each list file says
     bool refusesLists = false;             // no list file is given out

@@ -62,6 +62,13 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         int posted; // in all attempts
     } cases[] = {
         {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15},
+        {"every file is answered and none is stored, as by a script that fails",
+         [](FakeWebLab& l) {
+             for (const QString& name : {UploadFormRig::log(), UploadFormRig::sheet(), UploadFormRig::first(),
+                                         UploadFormRig::second(), UploadFormRig::third()})
+                 l.losses[name] = FakeLab::always;
+         },
+         false, 15},
         {"no list is given out", [](FakeWebLab& l) { l.refusesLists = true; }, false, 15},
         {"a list without a total",
          [](FakeWebLab& l) { l.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"; }, false,
@@ -82,6 +89,19 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
              l.deadPosts = 2;
          },
          true, 7},
+        // The two that it still lacks give the number of a list that there is.
+        {"a file that is lost twice and another that is lost once",
+         [](FakeWebLab& l) {
+             l.losses = {{UploadFormRig::first(), 2}, {UploadFormRig::third(), 1}};
+         },
+         true, 8},
+        // Nothing has arrived before, and no list has the number of five.
+        {"the server is back at the third attempt, with more files than there are lists",
+         [](FakeWebLab& l) {
+             l.deadCalls = 9;
+             l.deadPosts = 10;
+         },
+         false, 15},
     };
     for (const auto& c : cases) {
         SCOPED_TRACE(c.fault);
@@ -97,6 +117,73 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         EXPECT_EQ(other.localFiles().size(), 5u);
         EXPECT_EQ(faulty.posted.size(), c.posted);
     }
+}
+
+TEST_F(UploadFormTest, AServerThatIsBackAtTheThirdAttemptTakesAnOrderOfThreeFiles) {
+    for (const QString& name : {UploadFormRig::sheet(), UploadFormRig::third()})
+        ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() + u'\\' + name));
+    // Three calls of the check at load and of each attempt.
+    lab.deadCalls = 9;
+    lab.deadPosts = 6;
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(arrived());
+    EXPECT_EQ(lab.posted.size(), 9);
+    EXPECT_EQ(lab.urls.filter(QStringLiteral("filelisthom3.txt")).size(), 2);
+    EXPECT_EQ(lab.reports.size(), 2);
+}
+
+TEST_F(UploadFormTest, AReportThatNobodyTakesIsNotRepeatedAndChangesNothing) {
+    lab.onPost = [&](const QString& name) {
+        if (name == UploadFormRig::log()) // the last: the check's three calls pass, the report does not
+            lab.deadReports = 1;
+    };
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.done);
+    EXPECT_FALSE(page.failed);
+    ASSERT_EQ(lab.reports.size(), 2) << "the done call is made all the same";
+    EXPECT_TRUE(lab.reports[1].contains(QStringLiteral("/p.asp?")));
+    page.Command2_Click();
+    EXPECT_TRUE(page.done);
+    EXPECT_EQ(lab.reports.size(), 2) << "an order that is there is not reported again";
+}
+
+TEST_F(UploadFormTest, NothingIsWrittenOutsideTheOrderAndTheKeptList) {
+    const auto everything = [&] {
+        QStringList all;
+        for (const char* folder : {"C:\\", "C:\\2000lumora", "C:\\2000lumora\\!!000"})
+            all += rig.test.files.names(QString::fromLatin1(folder), QStringLiteral("*.*"));
+        return all;
+    };
+    const QStringList before = everything();
+    lab.listInstead = UploadFormRig::name().toLatin1() +
+                      "~~..\\..\\evil.txt~~/tmp/evil.txt~~C:\\2000lumora\\evil.txt~~021015GNB0000_03AABB.jpp~~total:4";
+    rig.send();
+    EXPECT_EQ(everything(), before + QStringList(QStringLiteral("filelist1.txt")));
+    EXPECT_EQ(rig.localFiles().size(), 5u);
+}
+
+TEST_F(UploadFormTest, ARestOfAnAttemptCanBeStoppedAndContinuedToo) {
+    lab.deadPosts = FakeLab::always;
+    UploadForm& page = rig.send();
+    ASSERT_TRUE(page.failed);
+    EXPECT_TRUE(page.Command3.visible && page.Image5.visible);
+    page.Command3_Click();
+    EXPECT_TRUE(page.Command10.visible);
+    EXPECT_FALSE(page.failed || page.Image5.visible || page.Command3.visible);
+    lab.deadPosts = 0;
+    page.Command10_Click();
+    rig.countDown();
+    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(arrived());
+}
+
+TEST_F(UploadFormTest, AListWithoutATotalMarksWhatItNames) {
+    UploadForm& page = rig.send();
+    lab.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp~~!105_1234.jpg";
+    page.Command7_Click();
+    EXPECT_EQ(page.TxtWeb.text, QStringLiteral("0"));
+    EXPECT_EQ(page.List4Hossarim.count(), 3);
 }
 
 TEST_F(UploadFormTest, SendAgainBeginsAnewWithThreeAttempts) {

@@ -54,6 +54,17 @@ TEST_F(UploadScriptTest, TheTwoFormsDifferInTypeVersionAndAnnouncedLength) {
     EXPECT_EQ(lab.posts[1].contentType, "multipart/form-data, boundary=OLA_GRAIN");
     EXPECT_EQ(lab.posts[0].announcedLength, 0);
     EXPECT_EQ(lab.posts[1].announcedLength, 249);
+    ASSERT_TRUE(test.files.writeWhole(QStringLiteral("C:\\b.jpg"), "12"));
+    const auto announced = [&](const QStringList& files) {
+        (void)script.MultipartPostInet(order, files, QStringLiteral("192.0.2.10"), QStringLiteral("/p/getfile2.php"),
+                                       QStringLiteral("C:\\"), {});
+        return lab.posts.back().announcedLength;
+    };
+    EXPECT_EQ(announced({path, QStringLiteral("C:\\b.jpg")}), 467);
+    EXPECT_EQ(lab.urls.last(), QStringLiteral("http://192.0.2.10/p/getfile2.php?folder=2026_11_21_KUP_1234^105&"))
+        << "an empty rest leaves its mark";
+    ASSERT_TRUE(test.files.writeWhole(path, {}));
+    EXPECT_EQ(announced({path}), 243);
     EXPECT_EQ(lab.posts[0].version, PostRequest::Version::Http11);
     EXPECT_EQ(lab.posts[1].version, PostRequest::Version::Http10);
 }

@@ -5,9 +5,16 @@
 
 #include <gtest/gtest.h>
 
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/SocketAddress.h>
+#include <Poco/Net/StreamSocket.h>
+
 #include <QFile>
 
+#include <array>
+#include <atomic>
 #include <filesystem>
+#include <thread>
 
 // A prepared order, the page that sends by HTTP, and real web servers that run the lab's scripts.
 namespace lumora {
@@ -75,6 +82,64 @@ TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
     relay.setFaults({.cutDataAfter = 20, .times = 2});
     rig.countDown();
     EXPECT_TRUE(rig.page().done) << rig.page().Label4Reason.hint.toStdString();
+    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+}
+
+TEST_F(SendByHttp, AServerThatAnswers500EndsInTheThreeAttemptsAndSendAgainStartsAnew) {
+    // Where the order's folder should be lies a file: the script can't store anything.
+    QFile inTheWay(toText(order(lab.uploads())));
+    ASSERT_TRUE(inTheWay.open(QIODevice::WriteOnly));
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.failed);
+    EXPECT_TRUE(page.Image5.visible);
+    EXPECT_EQ(page.Label12.text, QStringLiteral("5"));
+    EXPECT_EQ(page.Label10.text, QStringLiteral("00-0000000"));
+    EXPECT_TRUE(lab.reports().isEmpty());
+    EXPECT_EQ(lab.requests().join(" ").count("POST "), 15);
+    ASSERT_TRUE(inTheWay.remove());
+    page.Image5_Click();
+    EXPECT_TRUE(page.done);
+    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+    EXPECT_EQ(lab.reports().size(), 2);
+}
+
+TEST_F(SendByHttp, AServerThatIsDownIsToldAndTheOrderWaitsForIt) {
+    rig.state.profile.HttpHost = QStringLiteral("http://127.0.0.1:%1").arg(FreePort());
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.failed);
+    EXPECT_TRUE(page.Label4Reason.visible);
+    EXPECT_FALSE(page.Label4Reason.text.isEmpty());
+    rig.state.profile.HttpHost = lab.site();
+    page.Image5_Click();
+    EXPECT_TRUE(page.done);
+    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+}
+
+TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
+    // Takes a little of each request and resets the line.
+    Poco::Net::ServerSocket server(Poco::Net::SocketAddress("127.0.0.1", 0));
+    std::atomic<bool> stop = false;
+    std::thread closing([&] {
+        while (!stop) {
+            if (!server.poll(Poco::Timespan(0, 20'000), Poco::Net::Socket::SELECT_READ))
+                continue;
+            Poco::Net::StreamSocket line = server.acceptConnection();
+            std::array<char, 600> some;
+            line.receiveBytes(some.data(), static_cast<int>(some.size()));
+            line.setLinger(true, 0);
+            line.close();
+        }
+    });
+    rig.state.profile.HttpHost = QStringLiteral("http://127.0.0.1:%1").arg(server.address().port());
+    UploadForm& page = rig.send();
+    stop = true;
+    closing.join();
+    EXPECT_TRUE(page.failed);
+    EXPECT_TRUE(page.Label4Reason.visible);
+    EXPECT_EQ(page.List4Hossarim.count(), 5);
+    rig.state.profile.HttpHost = lab.site();
+    page.Image5_Click();
+    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString();
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
 }
 
