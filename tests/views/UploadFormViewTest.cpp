@@ -66,16 +66,18 @@ TEST_P(UploadFormLook, FromTheCheckThroughAFailureToTheEndPanel) {
     lookWhen(u"60-http-checking"_s, [&] { return page().Pic4Hamten.visible; });
     walk.program().chain().show(PageId::UploadForm);
     QObject::connect(&page(), &Page::changed, &page(), [&] { lookIfDue(); });
-    waitUntil([&] { return page().Timer2.running(); });
-    page().Timer2.stop();
+    waitUntil([&] { return page().Timer1.running(); });
+    page().Timer1.stop();
     look(walk, u"61-http-countdown"_s);
     walk.press(u"UploadForm"_s, u"Command3"_s);
     look(walk, u"62-http-stopped"_s);
     lookWhen(u"63-http-sending"_s, [&] { return page().percent >= 50; });
     lookWhen(u"64-http-sending-again"_s, [&] { return page().percent == 25 && !page().Label1.text.isEmpty(); });
     walk.press(u"UploadForm"_s, u"Command10"_s);
+    page().Timer1.stop();
     page().Label8.text = u"0"_s;
-    waitUntil([&] { return page().failed; });
+    page().Timer2_Tick();
+    ASSERT_TRUE(page().failed);
     look(walk, u"65-http-failed"_s);
 
     const LabServers lab;
