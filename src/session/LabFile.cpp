@@ -239,6 +239,46 @@ std::vector<Key> addressAndSwitchKeys() {
     };
 }
 
+std::vector<Key> mailKeys() {
+    const QString mail = QStringLiteral("Mail");
+    const QString address = QStringLiteral("one bare mail address such as orders@lab.example, or empty");
+    using D = Deployment;
+    const auto text = [](QString MailAccount::*field, const char* pattern) -> Setter {
+        return [field, pattern](D& d, const QString& value) {
+            if (!matches(value, pattern))
+                return false;
+            d.profile.mail.*field = value;
+            return true;
+        };
+    };
+    const char* const bareAddress = "([A-Za-z0-9.!#$%&'*+/=?^_`{|}~-]{1,64}@[A-Za-z0-9.-]{1,190})?";
+    return {
+        {mail, QStringLiteral("Server"), QStringLiteral("a host name or address without a port, or empty"),
+         text(&MailAccount::host, "([A-Za-z0-9._-]+|[0-9A-Fa-f:.]+)?")},
+        {mail, QStringLiteral("Port"), QStringLiteral("a whole number from 1 to 65535, or empty"),
+         [](D& d, const QString& value) {
+             if (!matches(value, "[0-9]{0,5}") || value.toInt() > 65535 || (!value.isEmpty() && value.toInt() == 0))
+                 return false;
+             d.profile.mail.port = static_cast<quint16>(value.toInt());
+             return true;
+         }},
+        {mail, QStringLiteral("User"), QStringLiteral("up to 80 characters"), text(&MailAccount::user, ".{0,80}")},
+        {mail, QStringLiteral("Password"), QStringLiteral("up to 80 characters"),
+         text(&MailAccount::password, ".{0,80}")},
+        {mail, QStringLiteral("Tls"), QStringLiteral("none, starttls or tls"),
+         [](D& d, const QString& value) {
+             const QStringList words = {QStringLiteral("none"), QStringLiteral("starttls"), QStringLiteral("tls")};
+             const qsizetype at = words.indexOf(value.toLower());
+             if (at < 0)
+                 return false;
+             d.profile.mail.encryption = static_cast<MailEncryption>(at);
+             return true;
+         }},
+        {mail, QStringLiteral("From"), address, text(&MailAccount::from, bareAddress)},
+        {mail, QStringLiteral("To"), address, text(&MailAccount::to, bareAddress)},
+    };
+}
+
 void addShopKeys(std::vector<Key>& keys) {
     using P = ClientProfile;
     const QString plain = QStringLiteral("up to 80 characters");
@@ -266,6 +306,8 @@ std::vector<Key> allKeys() {
     std::vector<Key> keys = serverAndClientKeys();
     std::vector<Key> more = addressAndSwitchKeys();
     keys.insert(keys.end(), std::make_move_iterator(more.begin()), std::make_move_iterator(more.end()));
+    const std::vector<Key> mail = mailKeys();
+    keys.insert(keys.end(), mail.begin(), mail.end());
     addShopKeys(keys);
     return keys;
 }
@@ -289,7 +331,7 @@ public:
             ++m_line;
             takeLine(line.trimmed());
         }
-        checkSender();
+        checkTogether();
         return std::move(m_reading);
     }
 
@@ -298,21 +340,29 @@ private:
         m_reading.errors += QStringLiteral("%1:%2: %3").arg(m_fileName).arg(m_line).arg(what);
     }
 
-    // Each key by itself may be empty; a lab that has chosen HTTP needs all three, or its first order would go nowhere.
-    void checkSender() {
-        if (m_reading.deployment.SugSheliach != 1)
-            return;
-        m_line = m_seen.value(QStringLiteral("Switches.Sender"));
+    // Each key by itself may be empty; with another that has been chosen it may not, or the first order would go
+    // nowhere.
+    void checkTogether() {
         const ClientProfile& profile = m_reading.deployment.profile;
-        const std::pair<QString, QString> needed[] = {{QStringLiteral("HttpHost"), profile.HttpHost},
-                                                      {QStringLiteral("HttpTikiya"), profile.HttpTikiya},
-                                                      {QStringLiteral("HttpScriptPath"), profile.HttpScriptPath}};
-        const QString section = QStringLiteral("Addresses");
+        if (m_reading.deployment.SugSheliach == 1)
+            checkFilled(QStringLiteral("Switches.Sender"), QStringLiteral("http"), QStringLiteral("Addresses"),
+                        {{QStringLiteral("HttpHost"), profile.HttpHost},
+                         {QStringLiteral("HttpTikiya"), profile.HttpTikiya},
+                         {QStringLiteral("HttpScriptPath"), profile.HttpScriptPath}});
+        if (profile.mail.setUp())
+            checkFilled(QStringLiteral("Mail.Server"), QStringLiteral("given"), QStringLiteral("Mail"),
+                        {{QStringLiteral("From"), profile.mail.from}, {QStringLiteral("To"), profile.mail.to}});
+    }
+
+    void checkFilled(const QString& chosen, const QString& as, const QString& section,
+                     const std::vector<std::pair<QString, QString>>& needed) {
+        m_line = m_seen.value(chosen);
         for (const auto& [name, value] : needed) {
             const QString fullName = section + u'.' + name;
             if (value.isEmpty() && m_reading.errors.filter(fullName).isEmpty()) // a wrong value is told already
-                fail(QStringLiteral("Switches.Sender is http, and %1 is empty; allowed with http: %2")
-                         .arg(fullName, QString(find(section, name)->allowed).remove(QStringLiteral(", or empty"))));
+                fail(QStringLiteral("%1 is %2, and %3 is empty; allowed with it: %4")
+                         .arg(chosen, as, fullName,
+                              QString(find(section, name)->allowed).remove(QStringLiteral(", or empty"))));
         }
     }
 
@@ -379,7 +429,7 @@ private:
                                 "character; allowed: %2")
                      .arg(fullName, key->allowed));
         else if (!key->set(m_reading.deployment, value))
-            fail(key->section == u"Server" || value.size() > 80
+            fail(key->section == u"Server" || key->section == u"Mail" || value.size() > 80
                      ? QStringLiteral("%1 has a wrong value; allowed: %2").arg(fullName, key->allowed)
                      : QStringLiteral("%1 has the wrong value \"%2\"; allowed: %3").arg(fullName, value, key->allowed));
     }
@@ -450,7 +500,7 @@ LabFileReading ReadLabFile(const HostPath& file) {
     if (holdsPassword(bytes) && (opened.permissions() & (QFile::ReadGroup | QFile::ReadOther)) != QFile::Permissions())
         reading.warnings +=
             QStringLiteral(
-                "%1: others on this machine can read the server's password; set the rights with: chmod 600 %1")
+                "%1: others on this machine can read the password of a server; set the rights with: chmod 600 %1")
                 .arg(name);
     return reading;
 }

@@ -33,6 +33,8 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
               "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = ask\n"
+              "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
+              "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -51,6 +53,11 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_TRUE(lab.SplitPage);
     EXPECT_EQ(lab.profile.ReportOn, 0);
     EXPECT_EQ(lab.MediniyutDchisa, 1);
+    const MailAccount& mail = lab.profile.mail;
+    EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
+              QStringList({"mail.lab.example", "a@b", "x^y", "kiosk@lab.example", "o'neil+orders@lab.example"}));
+    EXPECT_EQ(mail.port, 2525);
+    EXPECT_EQ(mail.encryption, MailEncryption::Tls);
     EXPECT_EQ(lab.profile.Shops[1].phone, u"03-5");
     EXPECT_EQ(lab.profile.Branches[9].caption, u"North");
     EXPECT_EQ(lab.profile.Branches[9].address[1], u"2nd floor");
@@ -105,6 +112,15 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
          {"lab.ini:5:", "Addresses.HttpScriptPath is empty", "begins and ends with a slash"}},
         {"[Addresses]\nHttpHost = a\nHttpTikiya = a\nHttpScriptPath = /\n[Switches]\nSender = http\n",
          {"lab.ini:2:", "Addresses.HttpHost", "no slash"}},
+        {"[Mail]\nServer = mail.example:25\nFrom = a@b\nTo = a@b\n", {"lab.ini:2:", "Mail.Server", "without a port"}},
+        {"[Mail]\nPort = 0\n", {"Mail.Port", "1 to 65535"}},
+        {"[Mail]\nPort = 65536\n", {"Mail.Port"}},
+        {"[Mail]\nTls = yes\n", {"Mail.Tls", "none, starttls or tls"}},
+        {"[Mail]\nFrom = lab\n", {"Mail.From", "orders@lab.example"}},
+        {"[Mail]\nServer = m\nFrom = a@b\nTo = <a@b>\n", {"lab.ini:4:", "Mail.To"}},
+        {"[Mail]\nServer = m\nFrom = a@b, c@d\nTo = a@b\n", {"lab.ini:3:", "Mail.From", "one bare mail address"}},
+        {"[Mail]\nServer = m\nTo = a@b\n", {"lab.ini:2:", "Mail.From is empty"}},
+        {"[Mail]\nFrom = a@b\nServer = m\nTo =\n", {"lab.ini:3:", "Mail.To is empty", "orders@lab.example"}},
         {"[Switches]\nReports = perhaps\n", {"Switches.Reports", "\"perhaps\"", "yes or no"}},
         {"[Drives]\nOrder = EDE\n", {"Drives.Order", "once"}},
         {"[Drives]\nProgramLetter = Z\n", {"Drives.ProgramLetter"}},
@@ -124,9 +140,9 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
 TEST(LabFileTest, TellsEveryFaultAtOnceAndNeverAPassword) {
     const QByteArray file =
         "[Server]\nPassword = secret^7\nUser = secret^7\nsecret7\nsecret-7 = 1\nHost = ftp://u:secret7@h\n"
-        "Password = secret7\n";
+        "Password = secret7\n[Mail]\nPassword = secret\x01\nServer = u:secret@m\nTo = secret\n";
     const QStringList errors = parse(file).errors;
-    EXPECT_EQ(errors.size(), 6);
+    EXPECT_EQ(errors.size(), 9);
     EXPECT_FALSE(errors.join(u'\n').contains(u"secret")) << errors.join(u'\n').toStdString();
 }
 
@@ -142,7 +158,8 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
         QStringList all = {p.FtpFolder1,   p.FtpFolder2,   p.ClientCode, p.FtpServer,  p.FtpPassword,
                            p.FtpUser,      p.LabName1,     p.LabName2,   p.LabMail,    p.LabPhone,
                            p.SiteUrl,      p.PriceListUrl, p.ReportUrl,  p.DoneUrl,    p.HttpDoneUrl,
-                           p.SettingsHost, p.ClientLetter, p.HttpHost,   p.HttpTikiya, p.HttpScriptPath};
+                           p.SettingsHost, p.ClientLetter, p.HttpHost,   p.HttpTikiya, p.HttpScriptPath,
+                           p.mail.host,    p.mail.user,    p.mail.from,  p.mail.to,    p.mail.password};
         for (const QString& size : p.SizeList)
             all += size;
         for (const QString& size : p.QuickSizes)
@@ -152,7 +169,8 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
         for (const int number :
              {int(p.JppBase), p.JppChunks, int(p.ReportOn), int(s.MediniyutDchisa), int(s.GvulMuzag), int(s.FitMuzag),
               int(s.TmunatPaar), int(s.MinuyPaar), int(s.SplitPage), int(s.TachanaMekomit), int(s.DoarReshut),
-              int(s.DeliveryChoiceMode), int(s.coupon.HaKoopon), int(s.transfer.SugSheliach)})
+              int(s.DeliveryChoiceMode), int(s.coupon.HaKoopon), int(s.transfer.SugSheliach), int(p.mail.port),
+              int(p.mail.encryption)})
             all += QString::number(number);
         return all;
     };
@@ -179,6 +197,7 @@ TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {
     EXPECT_TRUE(warnings[0].contains(name) && warnings[0].contains(u"chmod 600"));
     EXPECT_FALSE(warnings[0].contains(u"hush123"));
     EXPECT_TRUE(reading(secret, mine).warnings.isEmpty());
+    EXPECT_EQ(reading("[Mail]\npassword=hush\n", mine | QFile::ReadGroup).warnings.size(), 1);
     EXPECT_TRUE(reading("[Server]\nUser = u\n", mine | QFile::ReadOther).warnings.isEmpty());
 }
 
