@@ -1,11 +1,10 @@
 #include "platform/MailText.h"
 
-#include <Poco/Net/MailMessage.h>
-#include <Poco/Net/MailRecipient.h>
 #include <Poco/Net/MessageHeader.h>
 #include <Poco/Net/MultipartWriter.h>
 
 #include <QByteArrayList>
+#include <QDateTime>
 #include <QList>
 #include <QUuid>
 
@@ -19,9 +18,9 @@ bool plain(const QString& text) {
     return std::all_of(text.begin(), text.end(), [](QChar c) { return c.unicode() >= 0x20 && c.unicode() < 0x7F; });
 }
 
-// A word holds whole characters and has at most 75 letters with what is around it: 45 bytes of text.
+// A word holds whole characters, and a line with one has at most 76 letters, the field's name among them.
 QByteArray encodedWords(const QString& text) {
-    constexpr qsizetype bytesOfWord = 45;
+    constexpr qsizetype bytesOfWord = 39;
     QByteArrayList words;
     QByteArray word;
     for (const char32_t c : text.toUcs4()) {
@@ -75,23 +74,23 @@ std::string MailText(const MailAccount& account, const MailMessage& message, con
     QString body = message.body;
     body.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\n', QStringLiteral("\r\n"));
 
-    std::ostringstream content;
-    Poco::Net::MultipartWriter parts(content);
-    writePart(parts, content, "text/plain; charset=UTF-8", "inline", body.toUtf8());
-    writePart(parts, content, "application/octet-stream",
+    std::ostringstream text;
+    Poco::Net::MultipartWriter parts(text);
+    const QString id = QUuid::createUuid().toString(QUuid::WithoutBraces);
+    Poco::Net::MessageHeader head;
+    head.set("Date", QDateTime::currentDateTime().toString(Qt::RFC2822Date).toStdString());
+    head.set("From", account.from.toStdString());
+    head.set("To", account.to.toStdString());
+    head.set("Subject", subjectField(message.subject).toStdString());
+    head.set("Message-ID", QStringLiteral("<%1@%2>").arg(id, account.from.section(u'@', -1)).toStdString());
+    head.set("MIME-Version", "1.0");
+    head.set("Content-Type", "multipart/mixed; boundary=\"" + parts.boundary() + "\"");
+    head.write(text);
+    text << "\r\n";
+    writePart(parts, text, "text/plain; charset=UTF-8", "inline", body.toUtf8());
+    writePart(parts, text, "application/octet-stream",
               "attachment; " + fileNameParameter(toText(message.attachment.filename())), attachment);
     parts.close();
-
-    Poco::Net::MailMessage whole;
-    whole.setSender(account.from.toStdString());
-    whole.addRecipient({Poco::Net::MailRecipient::PRIMARY_RECIPIENT, account.to.toStdString()});
-    whole.setSubject(subjectField(message.subject).toStdString());
-    const QString id = QUuid::createUuid().toString(QUuid::WithoutBraces);
-    whole.set("Message-ID", QStringLiteral("<%1@%2>").arg(id, account.from.section(u'@', -1)).toStdString());
-    whole.setContentType("multipart/mixed; boundary=\"" + parts.boundary() + "\"");
-    whole.setContent(content.str(), Poco::Net::MailMessage::ENCODING_7BIT);
-    std::ostringstream text;
-    whole.write(text);
     return text.str();
 }
 

@@ -104,6 +104,8 @@ private:
         hello();
         if (m_account.encryption != MailEncryption::StartTls)
             return;
+        if (!offers("STARTTLS"))
+            throw Poco::Net::SMTPException("the server offers no encryption");
         ask("STARTTLS");
         // What had come in the open is forgotten with the old socket.
         socket() = Poco::Net::SecureStreamSocket::attach(socket(), m_account.host.toStdString(), verifyingContext());
@@ -206,8 +208,14 @@ MailOutcome sendNow(const MailAccount& account, const MailMessage& message, cons
     auto attachment = readWholeFile(message.attachment, name, largestAttachment);
     if (!attachment) {
         const Failure& failure = attachment.failure();
-        const bool missing = failure.kind == Failure::Kind::NotFound;
-        return {missing ? MailEnd::AttachmentMissing : MailEnd::AttachmentUnreadable, failure.message};
+        switch (failure.kind) {
+        case Failure::Kind::NotFound:
+            return {MailEnd::AttachmentMissing, failure.message};
+        case Failure::Kind::TooLarge:
+            return {MailEnd::TooLarge, failure.message};
+        default:
+            return {MailEnd::AttachmentUnreadable, failure.message};
+        }
     }
     for (const QString& address : {account.from, account.to}) {
         if (!isAddress(address))

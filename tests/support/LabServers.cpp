@@ -37,8 +37,9 @@ bool answers(quint16 port) {
     }
 }
 
-// False when the server ended, as on a port that another took meanwhile, or never answered.
-bool comesUp(QProcess& server, quint16 port) {
+} // namespace
+
+bool ComesUp(QProcess& server, quint16 port) {
     QElapsedTimer waiting;
     waiting.start();
     while (server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
@@ -48,8 +49,6 @@ bool comesUp(QProcess& server, quint16 port) {
     }
     return false;
 }
-
-} // namespace
 
 quint16 FreePort() {
     const Poco::Net::ServerSocket socket(Poco::Net::SocketAddress("127.0.0.1", 0));
@@ -111,7 +110,7 @@ SecondFtpServer::SecondFtpServer() {
                         QStringLiteral("127.0.0.1"), QStringLiteral("-p"), QString::number(m_port),
                         QStringLiteral("-w"), QStringLiteral("-d"), m_folder.path(), QStringLiteral("-u"), user(),
                         QStringLiteral("-P"), password()});
-        if (comesUp(m_server, m_port))
+        if (ComesUp(m_server, m_port))
             return;
     }
     m_failure = QStringLiteral("pyftpdlib did not start: ") + QString::fromUtf8(m_server.readAll());
@@ -149,7 +148,7 @@ SecondWebServer::SecondWebServer() {
         file.close();
         m_server.start(QStringLiteral("/usr/sbin/lighttpd"),
                        {QStringLiteral("-D"), QStringLiteral("-f"), configuration});
-        if (comesUp(m_server, m_port))
+        if (ComesUp(m_server, m_port))
             return;
     }
     m_failure = QStringLiteral("lighttpd did not start: ") + QString::fromUtf8(m_server.readAll());

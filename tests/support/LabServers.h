@@ -97,6 +97,10 @@ private:
     quint16 m_port = 0;
 };
 
+// Waits until the server answers on its port; false when it ended, as on a port that another took meanwhile, or never
+// answered.
+bool ComesUp(QProcess& server, quint16 port);
+
 // A port of 127.0.0.1 on which nothing listens at the moment.
 quint16 FreePort();
 

@@ -1,0 +1,187 @@
+#include "support/MailServer.h"
+
+#include "support/LabServers.h"
+
+#include <QElapsedTimer>
+#include <QFile>
+#include <QThread>
+
+#include <unistd.h>
+
+namespace lumora {
+namespace {
+
+// A server that takes mail for others is started by root and nobody else; it works on as a user of its own.
+QStringList asRoot(const QStringList& command) {
+    return ::geteuid() == 0 ? command : QStringList{QStringLiteral("sudo"), QStringLiteral("-n")} + command;
+}
+
+QByteArray outputOf(QStringList command) {
+    QProcess process;
+    process.start(command.takeFirst(), command);
+    return process.waitForFinished(20'000) ? process.readAllStandardOutput() : QByteArray();
+}
+
+// In the open the server asks for a proof and takes the password too; encrypted it takes the password alone, in one way
+// on each port. So each of the ways is walked.
+const char* const configuration = R"(primary_hostname = mail.lab.example
+spool_directory = %1/spool
+log_file_path = %1/log/%slog
+pid_file_path = %1/spool/pid
+local_interfaces = 127.0.0.1
+daemon_smtp_ports = %2 : %3
+tls_on_connect_ports = %3
+tls_certificate = %1/authority.pem
+tls_privatekey = %1/key.pem
+tls_advertise_hosts = %4
+message_size_limit = %5
+check_spool_space = %6
+check_spool_inodes = 0
+deliver_drop_privilege = true
+host_lookup =
+rfc1413_query_timeout = 0s
+keep_environment =
+acl_smtp_rcpt = recipient
+begin acl
+recipient:
+  deny !authenticated = *
+       message = log in first
+  require verify = recipient
+  accept
+begin routers
+box:
+  driver = accept
+  domains = lab.example
+  local_parts = orders
+  transport = box
+begin transports
+box:
+  driver = appendfile
+  file = %1/box/orders
+begin authenticators
+proof:
+  driver = cram_md5
+  public_name = CRAM-MD5
+  server_advertise_condition = ${if eq{$tls_in_cipher}{}}
+  server_secret = ${if eq{$auth1}{%7}{%8}fail}
+  server_set_id = $auth1
+plain:
+  driver = plaintext
+  public_name = PLAIN
+  server_advertise_condition = ${if eq{$received_port}{%2}}
+  server_condition = ${if and{{eq{$auth2}{%7}}{eq{$auth3}{%8}}}}
+  server_set_id = $auth2
+login:
+  driver = plaintext
+  public_name = LOGIN
+  server_prompts = Username:: : Password::
+  server_advertise_condition = ${if eq{$received_port}{%3}}
+  server_condition = ${if and{{eq{$auth1}{%7}}{eq{$auth2}{%8}}}}
+  server_set_id = $auth1
+)";
+
+} // namespace
+
+MailServer::MailServer(Disk disk, Encryption encryption) {
+    // The server's own user works in here.
+    const auto open = static_cast<QFile::Permissions>(0x7777);
+    QFile::setPermissions(m_folder.path(), static_cast<QFile::Permissions>(0x7711));
+    for (const char* name : {"spool", "log", "box"}) {
+        const QString path = m_folder.filePath(QLatin1String(name));
+        std::filesystem::create_directory(toHostPath(path));
+        QFile::setPermissions(path, open);
+    }
+    m_server.setProcessChannelMode(QProcess::MergedChannels);
+    if (!makeCertificate())
+        return;
+    for (int attempt = 0; attempt < 3; ++attempt) {
+        m_port = FreePort();
+        m_tlsPort = FreePort();
+        const QString file = configure(disk, encryption);
+        QStringList command =
+            asRoot({QStringLiteral("/usr/sbin/exim4"), QStringLiteral("-C"), file, QStringLiteral("-bdf")});
+        const QString program = command.takeFirst();
+        m_server.start(program, command);
+        if (ComesUp(m_server, m_port) && ComesUp(m_server, m_tlsPort))
+            return;
+    }
+    m_failure = QStringLiteral("exim4 did not start: ") + QString::fromUtf8(m_server.readAll());
+}
+
+MailServer::~MailServer() {
+    if (m_server.state() != QProcess::NotRunning) {
+        m_server.terminate();
+        if (!m_server.waitForFinished(5'000))
+            m_server.kill();
+        m_server.waitForFinished(5'000);
+    }
+    // What the server's user has made is beyond the temporary folder's own removal.
+    outputOf(asRoot({QStringLiteral("rm"), QStringLiteral("-rf"), m_folder.path()}));
+}
+
+QString MailServer::configure(Disk disk, Encryption encryption) const {
+    const QString path = m_folder.filePath(QStringLiteral("exim.conf"));
+    const MailAccount known = account();
+    QString text = QLatin1String(configuration);
+    text.replace(QStringLiteral("%1"), m_folder.path());
+    text.replace(QStringLiteral("%2"), QString::number(m_port));
+    text.replace(QStringLiteral("%3"), QString::number(m_tlsPort));
+    text.replace(QStringLiteral("%4"), encryption == Encryption::Offered ? QStringLiteral("*") : QString());
+    text.replace(QStringLiteral("%5"), QString::number(largestMessage));
+    // No disk has so much room left as the full one asks for.
+    text.replace(QStringLiteral("%6"), disk == Disk::Full ? QStringLiteral("1000000G") : QStringLiteral("0"));
+    text.replace(QStringLiteral("%7"), known.user);
+    text.replace(QStringLiteral("%8"), known.password);
+    QFile file(path);
+    if (file.open(QIODevice::WriteOnly | QIODevice::Truncate))
+        file.write(text.toUtf8());
+    file.close();
+    // It takes only a file of the user who starts it, and that no other may write to.
+    file.setPermissions(static_cast<QFile::Permissions>(0x6644));
+    outputOf(asRoot({QStringLiteral("chown"), QStringLiteral("root"), path}));
+    return path;
+}
+
+bool MailServer::makeCertificate() {
+    const QString key = m_folder.filePath(QStringLiteral("key.pem"));
+    QProcess openssl;
+    openssl.setProcessChannelMode(QProcess::MergedChannels);
+    openssl.start(QStringLiteral("/usr/bin/openssl"),
+                  {QStringLiteral("req"), QStringLiteral("-x509"), QStringLiteral("-newkey"), QStringLiteral("ec"),
+                   QStringLiteral("-pkeyopt"), QStringLiteral("ec_paramgen_curve:prime256v1"), QStringLiteral("-nodes"),
+                   QStringLiteral("-days"), QStringLiteral("2"), QStringLiteral("-subj"), QStringLiteral("/CN=lab"),
+                   QStringLiteral("-addext"), QStringLiteral("subjectAltName=IP:127.0.0.1"), QStringLiteral("-keyout"),
+                   key, QStringLiteral("-out"), authority()});
+    if (!openssl.waitForFinished(20'000) || openssl.exitCode() != 0) {
+        m_failure = QStringLiteral("openssl made no certificate: ") + QString::fromUtf8(openssl.readAll());
+        return false;
+    }
+    return QFile::setPermissions(key, static_cast<QFile::Permissions>(0x6644));
+}
+
+MailAccount MailServer::account(MailEncryption encryption) const {
+    MailAccount account;
+    account.host = QStringLiteral("127.0.0.1");
+    account.port = encryption == MailEncryption::Tls ? m_tlsPort : m_port;
+    account.encryption = encryption;
+    account.user = QStringLiteral("kiosk");
+    account.password = QStringLiteral("loopback lab");
+    account.from = QStringLiteral("kiosk@shop.example");
+    account.to = QStringLiteral("orders@lab.example");
+    return account;
+}
+
+QByteArray MailServer::mailbox() const {
+    // The server takes a message first and lays it into the box then.
+    QElapsedTimer waiting;
+    waiting.start();
+    while (waiting.elapsed() < 5'000 && log().count(" <= ") > log().count(" Completed\n"))
+        QThread::msleep(20);
+    return outputOf(asRoot({QStringLiteral("cat"), m_folder.filePath(QStringLiteral("box/orders"))}));
+}
+
+QByteArray MailServer::log() const {
+    return outputOf(asRoot({QStringLiteral("cat"), m_folder.filePath(QStringLiteral("log/mainlog"))}));
+}
+
+} // namespace lumora
