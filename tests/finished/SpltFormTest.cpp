@@ -150,6 +150,11 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     }
     EXPECT_EQ(test.dialogs.messages.size(), 2);
     EXPECT_FALSE(test.files.folderExists(at("meforakim\\moorkavim")));
+
+    test.dialogs.messages.clear();
+    choose("gone\\1_jpp_001_001.prk", &SpltForm::Command8_Click);
+    ASSERT_EQ(test.dialogs.messages.size(), 1);
+    EXPECT_TRUE(test.dialogs.messages[0].contains(at("gone")));
 }
 
 TEST_F(SpltFormTest, AFullDiskEndsTheWorkWithOneMessage) {
