@@ -188,20 +188,27 @@ private:
 TEST_F(MailTest, AServerThatFallsSilentOrLeavesIsNoContact) {
     const std::vector<std::string> whole = {"220 here\r\n", "250 good\r\n", "250 good\r\n", "250 good\r\n",
                                             "354 go\r\n"};
-    mail = SmtpMail(TimeLimits{Poco::Timespan(1, 0), Poco::Timespan(0, 300'000)});
+    const std::vector<std::string> startTls = {"220 here\r\n", "250-good\r\n250 STARTTLS\r\n", "220 go\r\n"};
+    mail = SmtpMail(TimeLimits{Poco::Timespan(0, 300'000), Poco::Timespan(0, 200'000)});
+    const auto expectNoContact = [&](MailEncryption encryption, const std::vector<std::string>& replies,
+                                     ScriptedServer::Then then) {
+        const ScriptedServer server(replies, then);
+        MailAccount account;
+        account.host = QStringLiteral("127.0.0.1");
+        account.port = server.port();
+        account.encryption = encryption;
+        account.from = account.to = QStringLiteral("a@lab.example");
+        QElapsedTimer time;
+        time.start();
+        expectEnd(3, account, "");
+        EXPECT_LT(time.elapsed(), 1'500) << int(encryption) << " after " << replies.size();
+    };
     for (const auto then : {ScriptedServer::Then::Silent, ScriptedServer::Then::HangUp}) {
-        for (std::size_t replies = 0; replies <= whole.size(); ++replies) {
-            const ScriptedServer server({whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(replies)}, then);
-            MailAccount account;
-            account.host = QStringLiteral("127.0.0.1");
-            account.port = server.port();
-            account.encryption = MailEncryption::None;
-            account.from = account.to = QStringLiteral("a@lab.example");
-            QElapsedTimer time;
-            time.start();
-            expectEnd(3, account, "");
-            EXPECT_LT(time.elapsed(), 1'000) << replies;
-        }
+        for (std::size_t replies = 0; replies <= whole.size(); ++replies)
+            expectNoContact(MailEncryption::None, {whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(replies)},
+                            then);
+        expectNoContact(MailEncryption::StartTls, startTls, then);
+        expectNoContact(MailEncryption::Tls, {}, then);
     }
 }
 
