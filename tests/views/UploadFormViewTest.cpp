@@ -89,6 +89,12 @@ TEST_P(UploadFormLook, FromTheCheckThroughAFailureToTheEndPanel) {
     waitUntil([&] { return page().done; });
     EXPECT_EQ(waits.size(), 0u) << qPrintable(waits.front().first);
     look(walk, u"67-http-sent"_s);
+    PageChain& chain = walk.program().chain();
+    chain.unload(PageId::UploadForm);
+    chain.show(PageId::UploadForm);
+    waitUntil([&] { return page().done; });
+    EXPECT_TRUE(page().Label11.visible);
+    look(walk, u"70-http-all-there"_s);
 }
 
 TEST_P(UploadFormLook, WithoutAServerAndWithoutAnOrder) {

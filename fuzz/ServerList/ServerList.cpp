@@ -1,0 +1,28 @@
+#include "transfer/ServerList.h"
+#include "common/AnsiCodePage.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <cstdlib>
+
+// The list that a web server gives of an order's folder. Whatever it says, what is missing is part of the order, and no
+// entry takes more than one file off it.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    using namespace lumora;
+    const QString folder = QStringLiteral("2026_11_21_KUP_1234^105");
+    const QStringList files = {QStringLiteral("C:\\o\\2026_11_21_KUP_1234^105.txt"), QStringLiteral("C:\\o\\!105.jpg"),
+                               QStringLiteral("C:\\o\\021015GNB0000_03AABB.jpp"), QStringLiteral("C:\\o\\1.jpp")};
+    const QByteArray bytes(reinterpret_cast<const char*>(data), static_cast<qsizetype>(size));
+    const ServerAnswer answer = ReadServerAnswer(AnsiCodePage::decode(bytes), folder);
+    const QStringList missing = MarkHossarim(files, answer.entries, folder);
+    bool holds = missing.size() + answer.entries.size() >= files.size();
+    for (const QString& file : missing)
+        holds = holds && files.contains(file);
+    for (const QString& entry : answer.entries)
+        holds = holds && !entry.trimmed().isEmpty() && !entry.contains(QStringLiteral("~~"));
+    if (answer.verdict == ServerVerdict::Listed)
+        holds = holds && answer.namesFolder && answer.entries.size() >= 2;
+    if (!holds)
+        std::abort();
+    return 0;
+}
