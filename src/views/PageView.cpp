@@ -289,8 +289,8 @@ void PageView::bindList(const QString& name, const TextList& list, QWidget* widg
     m_controls.push_back({name, widget, nullptr, &list, {}, std::move(row)});
 }
 
-void PageView::setDirectedIcon(QPushButton* button, bool forwards) {
-    const bool right = forwards != (layoutDirection() == Qt::RightToLeft);
+void PageView::setDirectedIcon(QPushButton* button, Way way) {
+    const bool right = (way == Way::Forwards) != (layoutDirection() == Qt::RightToLeft);
     const QString icon = right ? u"arrow-right"_s : u"arrow-left"_s;
     if (button->property("directedIcon") == icon)
         return; // a button that is given its icon again paints itself again

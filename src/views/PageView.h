@@ -100,8 +100,9 @@ protected:
     void bindHidden(const QString& name, const Caption& caption);
     void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr,
                   std::function<QString(const QString&)> row = {});
-    // The icon of a button that points forwards or backwards along the reading direction.
-    void setDirectedIcon(QPushButton* button, bool forwards);
+    // The icon of a button that points along the reading direction or against it.
+    enum class Way { Back, Forwards };
+    void setDirectedIcon(QPushButton* button, Way way);
 
     void setIcon(QAbstractButton* button, const QString& icon, QColor colour);
 

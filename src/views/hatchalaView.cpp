@@ -351,7 +351,7 @@ void hatchalaView::renderHelp() {
 }
 
 void hatchalaView::render() {
-    setDirectedIcon(m_start, true);
+    setDirectedIcon(m_start, Way::Forwards);
     m_start->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight); // the arrow behind the word
     m_how->setText(wording(u"הדפסת תמונות בשלושה צעדים פשוטים:"_s, u"Printing pictures takes three simple steps:"_s));
     m_steps[0]->setText(wording(u"בוחרים תמונות מהמחשב, מכרטיס הזיכרון או מהמצלמה"_s,

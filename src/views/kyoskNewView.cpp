@@ -546,10 +546,10 @@ void kyoskNewView::render() {
                   wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s, u"Few pixels: the print may come out blurred"_s),
                   wording(u"הצגת התמונה בגדול"_s, u"Look at the picture in large"_s));
     m_turn->setVisible(m_page.Image4.visible && !m_page.Picture2.bitmap.isNull());
-    setDirectedIcon(m_previous, false);
-    setDirectedIcon(m_next, true);
+    setDirectedIcon(m_previous, Way::Back);
+    setDirectedIcon(m_next, Way::Forwards);
     m_next->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight);
-    setDirectedIcon(m_backToPictures, false);
+    setDirectedIcon(m_backToPictures, Way::Back);
     // One main action at a time.
     m_finishAlbum->setVisible(m_page.Image13.visible && !m_page.Image7.visible);
     for (const char* name : {"Command24", "Command25", "Command23"})

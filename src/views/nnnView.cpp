@@ -364,7 +364,7 @@ void nnnView::render() {
     m_chosen->setText(isolated(m_page.Choice.text));
     if (m_page.step == nnn::Step::Terms)
         m_choiceStatus->hide();
-    setDirectedIcon(m_back, false);
+    setDirectedIcon(m_back, Way::Back);
     const bool moved = m_shownStep != m_page.step;
     m_shownStep = m_page.step;
     m_steps->setCurrentIndex(static_cast<int>(m_page.step));

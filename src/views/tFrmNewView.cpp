@@ -335,7 +335,7 @@ void tFrmNewView::renderTitles() {
         auto* step = findChild<QPushButton*>(QString::fromLatin1(name));
         step->setText({});
         const bool next = name == std::string_view("Image20");
-        setDirectedIcon(step, next);
+        setDirectedIcon(step, next ? Way::Forwards : Way::Back);
         speak(step, next ? m_page.Image20.text : m_page.Image21.text);
     }
     // The code counts from 180; people count from 0.

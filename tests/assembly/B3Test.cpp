@@ -12,8 +12,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 TEST_F(PreparingAnEditedOrder, writesTheLogThatTheLabExpectsToTheByte) {
     const QString newPicture = EditRecord::newPicture();
     givePicture(u"IMG_0012.jpg"_s);

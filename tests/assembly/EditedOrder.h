@@ -10,8 +10,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 using Changes = QList<std::pair<EditRecord::Column, QString>>;
 
 // A picture that was opened in the editor and left as it is, with some fields changed.

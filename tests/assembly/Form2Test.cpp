@@ -11,8 +11,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 TEST_F(PreparingAPlainOrder, writesTheLogThatTheLabExpectsToTheByte) {
     givePicture(u"IMG_0012.jpg"_s);
     giveFile(u"IMG_0013.jpg"_s, "no picture");

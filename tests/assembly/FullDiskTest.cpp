@@ -8,8 +8,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // The workspace on a disk that runs full in the middle of the order. Where this user may not mount one, files that may
 // not grow beyond a limit stand in for it.
 TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {

@@ -5,8 +5,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class CheckingAnOrder : public PreparingAPlainOrder {
 protected:
     CheckingAnOrder() {

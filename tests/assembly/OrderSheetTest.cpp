@@ -10,8 +10,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 QStringList linesOf(SessionState& state) {
     return plainSheetLines(state, FixedClock().now());
 }

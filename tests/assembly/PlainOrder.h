@@ -10,8 +10,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 // A picture with so much noise that its file is large for its size.
 inline Bitmap noisyPicture(int width, int height, unsigned seed) {
     Bitmap picture(width, height, Qt::gray);

@@ -11,8 +11,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class PrintingAgain : public PreparingAnEditedOrder {
 protected:
     QString giveNoise(const QString& name, int width, int height) {

@@ -8,8 +8,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // Left half and right half.
 Bitmap halves(int width, int height, QColor left, QColor right) {
     Bitmap picture(width, height, left);

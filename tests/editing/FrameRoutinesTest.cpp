@@ -13,8 +13,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class FrameRoutines : public ::testing::Test {
 protected:
     FrameRoutines() {

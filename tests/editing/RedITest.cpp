@@ -16,8 +16,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 constexpr QRgb skin = qRgb(180, 140, 120);
 constexpr QRgb pupil = qRgb(210, 42, 58);
 const QString undoCopy = u"C:\\2000lumora\\zmany\\tempred\\000.bmp"_s;

@@ -16,8 +16,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 inline const QString lying = u"C:\\p\\lying.jpg"_s;
 inline const QString standing = u"C:\\p\\standing.jpg"_s;
 

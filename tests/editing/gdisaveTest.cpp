@@ -8,8 +8,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class SavingPictures : public ::testing::Test, protected PageRig {
 protected:
     SavingPictures() {

@@ -3,8 +3,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // The caption's keyboard over a picture that is open in the editor.
 class CaptionKeys : public TheEditor {
 protected:

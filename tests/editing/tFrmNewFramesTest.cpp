@@ -3,8 +3,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 TEST_F(TheEditor, putsTheBordersFrameOnAPictureThatHasNone) {
     makeFrame(u"borders"_s, u"001"_s, Qt::green);
     state.shemot.Bord = u"WBX"_s;

@@ -5,8 +5,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
     page();
     EXPECT_TRUE(stored.isEmpty());

@@ -7,8 +7,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 using Panel = AlbumPanels::Panel;
 
 constexpr int albumTile = 6;

@@ -10,8 +10,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 // The details page with bare pages on both sides of it.
 class DetailsPageTest : public ::testing::Test, protected PageRig {
 protected:

@@ -14,8 +14,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
     const struct {
         QString letter;

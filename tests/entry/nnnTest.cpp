@@ -6,8 +6,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class nnnTest : public DetailsPageTest {
 protected:
     // A print order as far as the terms.

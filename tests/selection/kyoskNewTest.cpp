@@ -14,8 +14,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class ThePictures : public testing::Test, protected PageRig {
 protected:
     ThePictures() {

@@ -10,8 +10,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 class WorkspaceTest : public ::testing::Test {
 protected:
     WorkspaceTest() { state.DiskRoot = machine.drives.programRoot(); }

@@ -9,8 +9,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // Gives what a settings host would: the bytes of one file, or nothing.
 class SettingsSite : public NoInternet {
 public:
@@ -161,19 +159,6 @@ TEST_F(hatchalaTest, APressWithAShopChosenStartsWithTheShop) {
     ASSERT_EQ(chain.front()->id(), PageId::nnn);
     EXPECT_EQ(state.KodMishloach, u"OSK");
     EXPECT_EQ(state.profile.LabPhone, u"03-2");
-}
-
-TEST_F(hatchalaTest, TheQuestionOfTheShopCanBePutOff) {
-    deployment.DeliveryChoiceMode = 1;
-    hatchala& page = start();
-    page.Image1_MouseDown();
-    page.Image1_Click();
-    page.Picture1_Escape();
-    EXPECT_FALSE(page.Picture1.visible || page.Timer3.running());
-    EXPECT_TRUE(page.Timer5.running());
-    page.Image1_MouseDown();
-    page.Image1_Click();
-    EXPECT_TRUE(page.Picture1.visible && page.Timer3.running());
 }
 
 TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {

@@ -13,8 +13,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 // A prepared order on the disk and the sending page in front of it, over the line that the test brings.
 class FtpFrmRig {
 public:

@@ -18,6 +18,8 @@
 // answer.
 namespace lumora {
 
+using namespace Qt::StringLiterals; // tests write their texts in the short form
+
 class RecordedDialogs : public Dialogs {
 public:
     void message(const QString& text, const QString& title = {}) override {
@@ -121,7 +123,7 @@ public:
     QList<MailAccount> accounts; // one for each message
     QList<MailMessage> messages;
     std::function<void()> onSend; // what happens while a message is under way
-    QList<MailOutcome> outcomes; // of the next messages, in order; after them all succeed
+    QList<MailOutcome> outcomes;  // of the next messages, in order; after them all succeed
 };
 
 // The drives C: (in a temporary folder) and Z: with everything that a page asks for.

@@ -8,8 +8,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 const QString uploaded = u"הקבצים הועלו בהצלחה"_s;
@@ -439,6 +437,7 @@ TEST_F(FtpFrmTest, SpeaksNoHebrewOnAnEnglishPage) {
     });
     rig.countDown();
     EXPECT_EQ(page.Label3.text, u"Not all the files were uploaded"_s);
+    EXPECT_FALSE(remote().contains(FtpFrmRig::first())) << "what broke off is deleted";
     EXPECT_TRUE(found.isEmpty()) << found.join(u'\n').toStdString();
     for (const Caption* control : {&page.Command10, &page.Command28, &page.Picture7, &page.Label4Hamtana, &page.Label9})
         EXPECT_FALSE(hebrew(control->text)) << control->text.toStdString();

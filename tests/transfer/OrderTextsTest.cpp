@@ -12,8 +12,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 SessionState orderOfDana() {

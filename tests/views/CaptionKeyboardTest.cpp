@@ -22,9 +22,7 @@ class CaptionKeyboard : public PageLook {};
 } // namespace
 
 TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
-    Walk walk(GetParam().size);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
+    Walk walk(GetParam());
     PageChain& chain = walk.program().chain();
     SessionState& state = walk.program().state();
     state.edit.TextOn = 1;
@@ -54,8 +52,8 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
 }
 
 TEST_P(CaptionKeyboard, StandsBelowThePictureThatItWritesOn) {
-    Walk walk(GetParam().size);
-    walk.toEditor(GetParam().english);
+    Walk walk(GetParam());
+    walk.toEditor();
     walk.press(u"tFrmNew"_s, u"Command8"_s);
     walk.waitFor(u"mikledet"_s);
     walk.type(u"mikledet"_s, u"Text1"_s, GetParam().english ? u"Our summer 2024"_s : u"הקיץ שלנו 2024"_s);

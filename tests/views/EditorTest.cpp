@@ -26,8 +26,8 @@ class EditorLook : public PageLook {};
 } // namespace
 
 TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
-    Walk walk(GetParam().size);
-    walk.toEditor(GetParam().english);
+    Walk walk(GetParam());
+    walk.toEditor();
     look(walk, u"30-editor"_s);
     const QString editor = u"tFrmNew"_s;
     // What a customer sees is in reach, and what doubles it or is the operator's is not in the way.
@@ -79,8 +79,8 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
 
 // With the events of a mouse, as a scenario makes them.
 TEST(EditorByMouse, HoldsDragsAndTaps) {
-    Walk walk({1024, 768});
-    walk.toEditor(true);
+    Walk walk(Screen{{1024, 768}, true});
+    walk.toEditor();
     auto& page = walk.page<tFrmNew>(PageId::tFrmNew);
     auto& edit = walk.program().state().edit;
     const ControlFinder finder(walk.program().window());
@@ -138,7 +138,7 @@ TEST(EditorByMouse, HoldsDragsAndTaps) {
 
 TEST(EditorByKeyboard, ReachesEachToolAndLeavesByEsc) {
     Walk walk({1024, 768});
-    walk.toEditor(false);
+    walk.toEditor();
     walk.program().window().activateWindow();
     ASSERT_TRUE(QTest::qWaitForWindowActive(&walk.program().window()));
     ASSERT_TRUE(QApplication::focusWidget());

@@ -52,11 +52,8 @@ class FinishedOrdersLook : public PageLook {};
 } // namespace
 
 TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
-    Walk walk(GetParam().size, u"[Switches]\nSplitPage = yes\n"_s);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    walk.waitFor(u"nnn"_s);
+    Walk walk(GetParam(), u"[Switches]\nSplitPage = yes\n"_s);
+    walk.toMenu();
     walk.press(u"nnn"_s, u"Image1(4)"_s);
     walk.waitFor(u"MoogMeret"_s);
     // Nobody listens at this port.

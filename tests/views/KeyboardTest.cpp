@@ -109,8 +109,7 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
 TEST(Keyboard, PutsAnAlbumTogetherWithoutAMouse) {
     Walk walk({1024, 768});
     activate(walk);
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    walk.waitFor(u"nnn"_s);
+    walk.toMenu();
     press(walk, u"Image1(6)"_s);
     ASSERT_EQ(focusName(), u"Text1(0)"_s) << "the first box has the keyboard";
     text(u"Studio Or"_s);
@@ -165,12 +164,12 @@ TEST(Language, TurnsOverOnEachPageAndBack) {
             const QWidget* view = walk.program().window().findChild<QWidget*>(pageName(id));
             EXPECT_EQ(view->layoutDirection(), english == 1 ? Qt::LeftToRight : Qt::RightToLeft)
                 << qPrintable(pageName(id));
-            for (const QString& fault : walk.faults(english == 1))
+            for (const QString& fault : walk.faults())
                 ADD_FAILURE() << qPrintable(pageName(id)) << ": " << qPrintable(fault);
         }
     };
     flip(PageId::hatchala);
-    walk.toDetails(false);
+    walk.toDetails();
     flip(PageId::nnn);
     walk.toOptions();
     flip(PageId::nnn);

@@ -25,10 +25,6 @@ public:
         const Result<QString> found = finder().text(page, control);
         return found ? *found : u"? "_s + found.failure().message;
     }
-    void toMenu() {
-        press(u"hatchala"_s, u"Image1"_s);
-        waitFor(u"nnn"_s);
-    }
     // The first kind of order, up to the choice of the paper's kind; a border and a fit are passed where they are
     // asked.
     void toTermsOf(const QString& paper) {
@@ -89,7 +85,7 @@ TEST(LabSettings, TheBorderAndTheFitAreAskedForWhereTheLabWantsThem) {
     } cases[] = {{"", true, false, "B7"}, {"[Switches]\nBorderPage = no\nFitPage = yes\n", false, true, "NB"}};
     for (const auto& c : cases) {
         Lab lab(QString::fromLatin1(c.settings));
-        lab.toDetails(false);
+        lab.toDetails();
         lab.toOptions();
         lab.toBorder();
         EXPECT_EQ(lab.pressable(u"nnn"_s, u"Image13(1)"_s), c.border) << c.settings;

@@ -14,11 +14,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-struct Screen {
-    QSize size;
-    bool english;
-};
-
 inline void PrintTo(const Screen& screen, std::ostream* out) {
     *out << screen.size.width() << "x" << screen.size.height() << (screen.english ? " English" : " Hebrew");
 }
@@ -36,7 +31,7 @@ protected:
     void look(Walk& walk, const QString& name) {
         walk.settle(60);
         walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en" : u"he"));
-        for (const QString& fault : walk.faults(GetParam().english))
+        for (const QString& fault : walk.faults())
             ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
     }
     void changed(Page& page, Walk& walk) {

@@ -21,12 +21,9 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 TEST_P(PageLook, FromTheStartToTheTerms) {
-    Walk walk(GetParam().size);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
+    Walk walk(GetParam());
     look(walk, u"01-start"_s);
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    walk.waitFor(u"nnn"_s);
+    walk.toMenu();
     look(walk, u"02-menu"_s);
     if (walk.pressable(u"nnn"_s, u"Command14"_s)) {
         walk.press(u"nnn"_s, u"Command14"_s);
@@ -52,8 +49,8 @@ TEST_P(PageLook, FromTheStartToTheTerms) {
 }
 
 TEST_P(PageLook, FromThePicturesToTheSending) {
-    Walk walk(GetParam().size, u"[Switches]\nCoupon = no\n"_s);
-    walk.toDetails(GetParam().english);
+    Walk walk(GetParam(), u"[Switches]\nCoupon = no\n"_s);
+    walk.toDetails();
     walk.toOptions();
     walk.toBorder();
     walk.toTerms();
@@ -134,14 +131,11 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
 
 TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     Walk walk(
-        GetParam().size,
+        GetParam(),
         u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
         "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
         "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n"_s);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    walk.waitFor(u"nnn"_s);
+    walk.toMenu();
     walk.press(u"nnn"_s, u"Image1(2)"_s);
     walk.toOptions();
     const auto& sizes = walk.page<nnn>(PageId::nnn).Combo1List;
@@ -168,9 +162,7 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
 }
 
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
-    Walk walk(GetParam().size);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
+    Walk walk(GetParam());
     SessionState& state = walk.program().state();
     state.Optint = 2;
     state.shemot.ppr = u"10/15"_s;
@@ -200,11 +192,8 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
 }
 
 TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
-    Walk walk(GetParam().size, u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    walk.waitFor(u"nnn"_s);
+    Walk walk(GetParam(), u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
+    walk.toMenu();
     walk.press(u"nnn"_s, u"Image1(6)"_s);
     const ControlFinder finder(walk.program().window());
     const auto lookAtRest = [&](const QString& name) {

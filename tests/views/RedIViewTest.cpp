@@ -53,9 +53,7 @@ Bitmap flashPhotograph() {
 class RedEyeView : public PageLook {
 protected:
     RedEyeView()
-        : walk(GetParam().size) {
-        if (GetParam().english)
-            walk.press(u"hatchala"_s, u"Check1"_s);
+        : walk(GetParam()) {
         const QString path = walk.pictureFolder() + u"\\IMG_0001.jpg"_s;
         EXPECT_TRUE(saveJpeg(flashPhotograph(), *walk.program().platform().files.drives().toHost(path), 95).ok());
         walk.program().state().edit.PicturePath = path;

@@ -21,9 +21,7 @@ class PiecesLook : public PageLook {};
 
 // An order folder is cut, a piece is lost, and what is left is joined: by pressing what the operator sees.
 TEST_P(PiecesLook, ThePageOfPieces) {
-    Walk walk(GetParam().size, u"[Switches]\nSplitPage = yes\n"_s);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
+    Walk walk(GetParam(), u"[Switches]\nSplitPage = yes\n"_s);
     EXPECT_TRUE(walk.program().state().SplitPage);
     const Files& files = walk.program().platform().files;
     const QString order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_s;

@@ -70,10 +70,8 @@ protected:
 } // namespace
 
 TEST_P(StartLook, TheStartPageInEachOfItsStates) {
-    Walk walk(GetParam().size, u"[Switches]\nDeliveryQuestion = yes\n"_s);
+    Walk walk(GetParam(), u"[Switches]\nDeliveryQuestion = yes\n"_s);
     hatchala& page = startPage(walk);
-    if (GetParam().english)
-        walk.press(u"hatchala"_s, u"Check1"_s);
     mouseGoes(walk, u"Image11"_s, true);
     look(walk, u"01-start-help"_s);
     mouseGoes(walk, u"Image11"_s, false);

@@ -149,6 +149,12 @@ Walk::Walk(QSize size, const QString& labSettings) {
     settle(60);
 }
 
+Walk::Walk(const Screen& screen, const QString& labSettings)
+    : Walk(screen.size, labSettings) {
+    if (screen.english)
+        press(u"hatchala"_s, u"Check1"_s);
+}
+
 Walk::~Walk() = default;
 
 QString Walk::pictureFolder() const {
@@ -188,11 +194,13 @@ void Walk::waitFor(const QString& page) {
     settle();
 }
 
-void Walk::toDetails(bool english) {
-    if (english)
-        press(u"hatchala"_s, u"Check1"_s);
+void Walk::toMenu() {
     press(u"hatchala"_s, u"Image1"_s);
     waitFor(u"nnn"_s);
+}
+
+void Walk::toDetails() {
+    toMenu();
     press(u"nnn"_s, u"Image1(0)"_s);
 }
 
@@ -250,12 +258,9 @@ void Walk::writeFrames() {
     }
 }
 
-void Walk::toEditor(bool english) {
+void Walk::toEditor() {
     writeFrames();
-    if (english)
-        press(u"hatchala"_s, u"Check1"_s);
-    press(u"hatchala"_s, u"Image1"_s);
-    waitFor(u"nnn"_s);
+    toMenu();
     press(u"nnn"_s, u"Image1(1)"_s);
     toOptions();
     press(u"nnn"_s, u"Option1(0)"_s);
@@ -279,7 +284,8 @@ void Walk::shot(const QString& name) {
         m_program->window().grab().save(u"%1/%2-%3x%4.png"_s.arg(folder, name).arg(size.width()).arg(size.height())));
 }
 
-QStringList Walk::faults(bool english) {
+QStringList Walk::faults() {
+    const bool english = m_program->state().english();
     QStringList result;
     MainWindow& window = m_program->window();
     unnamed(QAccessible::queryAccessibleInterface(&window), result);

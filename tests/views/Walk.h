@@ -13,11 +13,18 @@
 
 namespace lumora {
 
+struct Screen {
+    QSize size;
+    bool english;
+};
+
 // The whole program on a fresh drive with a folder of pictures, used as a customer uses it: by pressing controls that
 // are visible, enabled and not covered. A step that fails is a failure of the test that takes it.
 class Walk {
 public:
     explicit Walk(QSize size, const QString& labSettings = {});
+    // In that language, turned to on the start page.
+    explicit Walk(const Screen& screen, const QString& labSettings = {});
     ~Walk();
 
     Program& program() { return *m_program; }
@@ -35,7 +42,8 @@ public:
     void settle(int milliseconds = 30);
 
     // From the start page to the page and step named.
-    void toDetails(bool english);
+    void toMenu();
+    void toDetails();
     void toOptions();
     void toBorder();
     void toTerms();
@@ -43,12 +51,12 @@ public:
     void choosePictures();
     void toClosing();
     // A quick order with the first picture open in the editor. The lab has frames in two categories.
-    void toEditor(bool english);
+    void toEditor();
 
     // Writes the window to the folder that LUMORA_SHOTS names; without one nothing is written.
     void shot(const QString& name);
     // All that is wrong with what the window shows now: each line names the control.
-    QStringList faults(bool english);
+    QStringList faults();
 
 private:
     Page* find(PageId id);

@@ -15,8 +15,6 @@
 // A prepared order, the sending page, a real FTP server behind a bad line, and a real web server.
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 const QString uploaded = u"הקבצים הועלו בהצלחה"_s;
