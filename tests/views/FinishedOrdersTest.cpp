@@ -90,6 +90,11 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     look(walk, u"65-walk-ended"_s);
     EXPECT_EQ(page.package(0), MoogMeret::Package::Failed);
     walk.press(u"MoogMeret"_s, u"Command4Orders"_s);
+    // The operator's page leads back to the orders.
+    walk.press(u"MoogMeret"_s, u"Command4Pieces"_s);
+    walk.waitFor(u"SpltForm"_s);
+    walk.program().chain().unload(PageId::SpltForm);
+    walk.waitFor(u"MoogMeret"_s);
 
     ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"List3"_s, pieces).ok());
     EXPECT_EQ(page.File1.markedCount(), 4);
