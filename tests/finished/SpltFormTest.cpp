@@ -1,42 +1,33 @@
 #include "finished/SpltForm.h"
 
-#include "session/PageChain.h"
-#include "session/SessionState.h"
+#include "support/PageRig.h"
 #include "support/SmallDisk.h"
-#include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
 
 namespace lumora {
 namespace {
 
-struct SpltFormTest : ::testing::Test {
-    TestPlatform test;
-    SessionState state;
-    PageChain chain{test.pump};
-
+struct SpltFormTest : ::testing::Test, PageRig {
     SpltFormTest() {
-        state.DiskRoot = QStringLiteral("C:\\");
         state.EnglishTips = 1;
-        for (const char* folder : {"C:\\order", "C:\\order\\sub"})
-            (void)test.files.makeFolder(QString::fromLatin1(folder));
-        chain.registerPage(PageId::MoogMeret, [] { return std::make_unique<Page>(PageId::MoogMeret); });
-        chain.registerPage(PageId::SpltForm,
-                           [this] { return std::make_unique<SpltForm>(state, test.platform, chain); });
+        makeFolder(u"C:\\order\\sub"_s);
+        registerBare({PageId::MoogMeret});
+        registerPage<SpltForm>(PageId::SpltForm);
         chain.show(PageId::MoogMeret);
         chain.show(PageId::SpltForm);
     }
     SpltForm& page() { return static_cast<SpltForm&>(*chain.find(PageId::SpltForm)); }
-    static QString at(const char* leaf) { return QStringLiteral("C:\\order\\") + QString::fromLatin1(leaf); }
+    static QString at(const char* leaf) { return u"C:\\order\\"_s + QString::fromLatin1(leaf); }
     void write(const QString& path, const QByteArray& bytes) {
-        ASSERT_TRUE(test.files.writeWhole(path, bytes).ok()) << path.toStdString();
+        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.toStdString();
     }
     QByteArray read(const QString& path) const {
-        const auto bytes = test.files.read(path);
+        const auto bytes = machine.files.read(path);
         return bytes ? *bytes : QByteArrayLiteral("can't be read");
     }
     void choose(const char* leaf, void (SpltForm::*click)()) {
-        test.dialogs.picks = {at(leaf)};
+        machine.dialogs.picks = {at(leaf)};
         (page().*click)();
     }
 };
@@ -46,60 +37,60 @@ TEST_F(SpltFormTest, AFolderIsCutAndItsFamiliesAreJoinedAgain) {
     write(at("2.jpp"), "abcde");
     write(at("3.jpp"), "wxyz");
     write(at("order.txt"), "not cut");
-    EXPECT_EQ(page().Text2.text, QStringLiteral("400000"));
+    EXPECT_EQ(page().Text2.text, u"400000"_s);
     choose("order.txt", &SpltForm::Command2_Click);
     EXPECT_EQ(page().List4files.items(), QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
-    page().Text2_Change(QStringLiteral("4"));
+    page().Text2_Change(u"4"_s);
     page().Command3_Click();
     EXPECT_EQ(page().outcome, SpltForm::Outcome::Good);
-    EXPECT_TRUE(page().Label4Total.text.startsWith(QStringLiteral("Files cut: 3, pieces: 6.")))
+    EXPECT_TRUE(page().Label4Total.text.startsWith(u"Files cut: 3, pieces: 6."_s))
         << page().Label4Total.text.toStdString();
     EXPECT_EQ(page().Label4Where.text, at("meforakim"));
 
     choose("meforakim\\1_jpp_001_003.prk", &SpltForm::Command8_Click);
     EXPECT_TRUE(page().List4files.isEmpty());
-    EXPECT_EQ(page().Label1.text, QStringLiteral("6"));
-    EXPECT_EQ(page().Label5.text, QStringLiteral("3"));
-    EXPECT_EQ(page().familyWords(0), QStringLiteral("Complete: 3 of 3"));
-    EXPECT_EQ(page().familyWords(2), QStringLiteral("Short: 1 of 2")) << "an exact multiple";
+    EXPECT_EQ(page().Label1.text, u"6"_s);
+    EXPECT_EQ(page().Label5.text, u"3"_s);
+    EXPECT_EQ(page().familyWords(0), u"Complete: 3 of 3"_s);
+    EXPECT_EQ(page().familyWords(2), u"Short: 1 of 2"_s) << "an exact multiple";
     page().Command1_Click();
     EXPECT_EQ(read(at("meforakim\\moorkavim\\1.jpp")), "0123456789");
     EXPECT_EQ(read(at("meforakim\\moorkavim\\2.jpp")), "abcde");
-    EXPECT_FALSE(test.files.fileExists(at("meforakim\\moorkavim\\3.jpp")));
+    EXPECT_FALSE(machine.files.fileExists(at("meforakim\\moorkavim\\3.jpp")));
     EXPECT_EQ(page().outcome, SpltForm::Outcome::Partly);
     EXPECT_EQ(page().List4Bodedim.currentIndex(), 2) << "each family is selected before it is asked";
     page().Command4_Click();
     EXPECT_EQ(read(at("meforakim\\moorkavim\\3.jpp")), "wxyz");
-    EXPECT_TRUE(page().Label4Total.text.contains(QStringLiteral("declares 2")));
-    EXPECT_EQ(test.dialogs.messages, QStringList());
+    EXPECT_TRUE(page().Label4Total.text.contains(u"declares 2"_s));
+    EXPECT_EQ(machine.dialogs.messages, QStringList());
 }
 
 TEST_F(SpltFormTest, ReadingAgainAddsAndTheSameFolderTwiceIsTold) {
     write(at("a_jpp_001_001.prk"), "a");
     write(at("sub\\a_jpp_001_001.prk"), "b");
     choose("a_jpp_001_001.prk", &SpltForm::Command8_Click);
-    EXPECT_EQ(page().Label1.text, QStringLiteral("2"));
-    EXPECT_EQ(page().Label5.text, QStringLiteral("2")) << "two folders, two families";
+    EXPECT_EQ(page().Label1.text, u"2"_s);
+    EXPECT_EQ(page().Label5.text, u"2"_s) << "two folders, two families";
     choose("sub\\a_jpp_001_001.prk", &SpltForm::Command8_Click);
-    EXPECT_EQ(page().Label1.text, QStringLiteral("3"));
-    EXPECT_EQ(page().Label5.text, QStringLiteral("2"));
-    EXPECT_EQ(page().familyWords(0), QStringLiteral("Complete: 1 of 1"));
-    EXPECT_EQ(page().familyWords(1), QStringLiteral("Surplus: the folder was read more than once"));
+    EXPECT_EQ(page().Label1.text, u"3"_s);
+    EXPECT_EQ(page().Label5.text, u"2"_s);
+    EXPECT_EQ(page().familyWords(0), u"Complete: 1 of 1"_s);
+    EXPECT_EQ(page().familyWords(1), u"Surplus: the folder was read more than once"_s);
     page().List4Bodedim_Click(1);
     EXPECT_EQ(page().List4Famely.count(), 2);
     page().ListChalakim_Click(1);
     page().Command6_Click();
-    EXPECT_EQ(page().Label8.text, QStringLiteral("1"));
-    EXPECT_EQ(page().Label9.text, QStringLiteral("C:"));
+    EXPECT_EQ(page().Label8.text, u"1"_s);
+    EXPECT_EQ(page().Label9.text, u"C:"_s);
 }
 
 TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElse) {
     write(at("a_jpp_001_001.prk"), "abcdef");
     write(at("a.jpp"), "abcdef");
-    page().Text2_Change(QStringLiteral("4"));
+    page().Text2_Change(u"4"_s);
     choose("a.jpp", &SpltForm::Command9_Click);
     EXPECT_EQ(page().outcome, SpltForm::Outcome::Partly);
-    EXPECT_FALSE(test.files.folderExists(at("meforakim")));
+    EXPECT_FALSE(machine.files.folderExists(at("meforakim")));
     choose("a_jpp_001_001.prk", &SpltForm::Command9_Click);
     EXPECT_EQ(read(at("meforakim\\a_jpp_001_001_prk_002_002.prk")), "ef");
 }
@@ -111,7 +102,7 @@ TEST_F(SpltFormTest, ACancelledPickChangesNothing) {
         (page().*click)();
     EXPECT_EQ(page().List4files.count(), 1);
     EXPECT_EQ(page().ListChalakim.count(), 0);
-    EXPECT_EQ(test.dialogs.messages, QStringList());
+    EXPECT_EQ(machine.dialogs.messages, QStringList());
 }
 
 TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
@@ -119,57 +110,57 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     write(at("2.jpp"), "abcde");
     choose("1.jpp", &SpltForm::Command2_Click);
     for (const char* text : {"", "0", "-1", "x", "2147483648"}) {
-        test.dialogs.messages.clear();
+        machine.dialogs.messages.clear();
         page().Text2_Change(QString::fromLatin1(text));
         page().Command3_Click();
         choose("1.jpp", &SpltForm::Command9_Click);
-        ASSERT_EQ(test.dialogs.messages.size(), 2) << text;
-        EXPECT_TRUE(test.dialogs.messages[0].contains(QStringLiteral("2147483647")));
+        ASSERT_EQ(machine.dialogs.messages.size(), 2) << text;
+        EXPECT_TRUE(machine.dialogs.messages[0].contains(u"2147483647"_s));
     }
-    EXPECT_FALSE(test.files.folderExists(at("meforakim")));
+    EXPECT_FALSE(machine.files.folderExists(at("meforakim")));
 
-    test.dialogs.messages.clear();
-    page().Text2_Change(QStringLiteral("4"));
-    ASSERT_TRUE(test.files.removeFile(at("1.jpp")).ok());
+    machine.dialogs.messages.clear();
+    page().Text2_Change(u"4"_s);
+    ASSERT_TRUE(machine.files.removeFile(at("1.jpp")).ok());
     page().Command3_Click();
-    ASSERT_EQ(test.dialogs.messages.size(), 1);
-    EXPECT_TRUE(test.dialogs.messages[0].contains(at("1.jpp")));
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("1.jpp")));
     EXPECT_EQ(page().outcome, SpltForm::Outcome::Failed);
     EXPECT_EQ(read(at("meforakim\\2_jpp_002_002.prk")), "e");
 
-    test.dialogs.messages.clear();
+    machine.dialogs.messages.clear();
     write(at("meforakim\\a.prk"), "short name");
     choose("meforakim\\2_jpp_001_002.prk", &SpltForm::Command8_Click);
     ASSERT_EQ(page().List4Bodedim.count(), 2);
-    ASSERT_TRUE(test.files.removeFile(at("meforakim\\2_jpp_001_002.prk")).ok());
+    ASSERT_TRUE(machine.files.removeFile(at("meforakim\\2_jpp_001_002.prk")).ok());
     for (int i = 0; i < 2; ++i) {
         page().List4Bodedim_Click(i);
         page().Command4_Click();
         EXPECT_EQ(page().outcome, SpltForm::Outcome::Failed);
-        EXPECT_EQ(page().familyWords(i), QStringLiteral("Not joined"));
+        EXPECT_EQ(page().familyWords(i), u"Not joined"_s);
     }
-    EXPECT_EQ(test.dialogs.messages.size(), 2);
-    EXPECT_FALSE(test.files.folderExists(at("meforakim\\moorkavim")));
+    EXPECT_EQ(machine.dialogs.messages.size(), 2);
+    EXPECT_FALSE(machine.files.folderExists(at("meforakim\\moorkavim")));
 
-    test.dialogs.messages.clear();
+    machine.dialogs.messages.clear();
     choose("gone\\1_jpp_001_001.prk", &SpltForm::Command8_Click);
-    ASSERT_EQ(test.dialogs.messages.size(), 1);
-    EXPECT_TRUE(test.dialogs.messages[0].contains(at("gone")));
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("gone")));
 }
 
 TEST_F(SpltFormTest, AFullDiskEndsTheWorkWithOneMessage) {
     const SmallDisk disk(64);
     if (!disk.available())
         GTEST_SKIP() << "no right to mount a disk";
-    std::filesystem::create_directory_symlink(disk.path(), *test.drives.toHost(at("small")));
+    std::filesystem::create_directory_symlink(disk.path(), host(at("small")));
     write(at("small\\1.jpp"), QByteArray(36000, '1'));
     write(at("small\\2.jpp"), QByteArray(100, '2'));
     choose("small\\1.jpp", &SpltForm::Command2_Click);
-    page().Text2_Change(QStringLiteral("9000"));
+    page().Text2_Change(u"9000"_s);
     page().Command3_Click();
-    ASSERT_EQ(test.dialogs.messages.size(), 1);
-    EXPECT_TRUE(test.dialogs.messages[0].contains(QStringLiteral("Pieces written: 2 of 5")))
-        << test.dialogs.messages[0].toStdString();
+    ASSERT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"Pieces written: 2 of 5"_s))
+        << machine.dialogs.messages[0].toStdString();
     EXPECT_EQ(read(at("small\\1.jpp")), QByteArray(36000, '1'));
 }
 
@@ -177,20 +168,20 @@ TEST_F(SpltFormTest, TheOperatorMayStopOrLeaveBetweenTwoPieces) {
     write(at("1.jpp"), "0123456789");
     write(at("2.jpp"), "0123456789");
     choose("1.jpp", &SpltForm::Command2_Click);
-    page().Text2_Change(QStringLiteral("2"));
-    test.pump.onPump = [&] {
+    page().Text2_Change(u"2"_s);
+    machine.pump.onPump = [&] {
         EXPECT_TRUE(page().Command15.visible);
         EXPECT_FALSE(page().Command3.enabled);
         page().Command3_Click(); // nothing begins below
-        if (test.pump.count == 4)
+        if (machine.pump.count == 4)
             page().Command15_Click();
     };
     page().Command3_Click();
-    EXPECT_EQ(test.files.names(at("meforakim"), {u'*'}).size(), 3);
+    EXPECT_EQ(machine.files.names(at("meforakim"), {u'*'}).size(), 3);
     EXPECT_FALSE(page().busy);
-    EXPECT_TRUE(page().Label4Total.text.contains(QStringLiteral("stopped")));
+    EXPECT_TRUE(page().Label4Total.text.contains(u"stopped"_s));
 
-    test.pump.onPump = [&] { page().Image3_Click(); };
+    machine.pump.onPump = [&] { page().Image3_Click(); };
     page().Command3_Click();
     EXPECT_EQ(chain.front()->id(), PageId::MoogMeret);
     EXPECT_FALSE(chain.find(PageId::SpltForm));
