@@ -8,6 +8,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 TEST(MailResultTest, OnlyTheCodesWithoutWordsGiveNone) {
     const QList<int> silent = {16, 17, 19, 20, 22, 23, 24, 26};
     const QList<int> unclear = {-1, 7, 15, 25, 27, 1000};
@@ -18,8 +20,7 @@ TEST(MailResultTest, OnlyTheCodesWithoutWordsGiveNone) {
             EXPECT_EQ(text == MailResultText(-1, english), unclear.contains(code) || code > 26) << code;
         }
     }
-    EXPECT_EQ(MailResultText(3, false),
-              QStringLiteral(" תוכנת הדואר לא הוגדרה כראוי") + QStringLiteral("המחשב לא יצר קשר עם שרת הדואר שלך"));
+    EXPECT_EQ(MailResultText(3, false), u" תוכנת הדואר לא הוגדרה כראוי"_s + u"המחשב לא יצר קשר עם שרת הדואר שלך"_s);
 }
 
 TEST(MailResultTest, EveryEndOfAnExchangeHasItsOwnWords) {

@@ -10,8 +10,10 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 LabFileReading parse(const QByteArray& bytes) {
-    return ParseLabFile(bytes, QStringLiteral("lab.ini"));
+    return ParseLabFile(bytes, u"lab.ini"_s);
 }
 
 TEST(LabFileTest, AnEmptyFileLeavesTheDefaults) {
@@ -181,7 +183,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
 
 TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {
     QTemporaryDir folder;
-    const QString name = folder.filePath(QStringLiteral("lab.ini"));
+    const QString name = folder.filePath(u"lab.ini"_s);
     const auto reading = [&](const QByteArray& content, QFile::Permissions rights) {
         QFile file(name);
         EXPECT_TRUE(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
@@ -205,7 +207,7 @@ TEST(LabFileTest, FindsTheFirstFileThatIsThereAndTellsOfOneItCannotRead) {
     QTemporaryDir folder;
     const HostPath base = toHostPath(folder.path());
     EXPECT_FALSE(FindLabFile({base / "a.ini", base / "b.ini"}));
-    QFile second(folder.filePath(QStringLiteral("b.ini")));
+    QFile second(folder.filePath(u"b.ini"_s));
     ASSERT_TRUE(second.open(QIODevice::WriteOnly));
     EXPECT_EQ(FindLabFile({base / "a.ini", base / "b.ini"}), base / "b.ini");
     EXPECT_EQ(ReadLabFile(base / "a.ini").errors.size(), 1);

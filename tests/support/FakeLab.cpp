@@ -5,6 +5,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 Failure refused(const QString& why) {
@@ -12,7 +14,7 @@ Failure refused(const QString& why) {
 }
 
 Failure cut() {
-    return {Failure::Kind::Disconnected, QStringLiteral("the line was cut")};
+    return {Failure::Kind::Disconnected, u"the line was cut"_s};
 }
 
 // True as often as the counter says.
@@ -34,7 +36,7 @@ public:
             return cut();
         const QString target = directory.startsWith(u'/') ? directory.mid(1) : below(directory);
         if (!m_lab.folders.contains(target) || (m_lab.refusesEntry && target.contains(u'^')))
-            return refused(QStringLiteral("550 Failed to change directory."));
+            return refused(u"550 Failed to change directory."_s);
         m_here = target;
         return {};
     }
@@ -49,7 +51,7 @@ public:
         if (m_cut)
             return cut();
         if (m_lab.refusesFolders || m_lab.folders.contains(below(name)))
-            return refused(QStringLiteral("550 Create directory operation failed."));
+            return refused(u"550 Create directory operation failed."_s);
         m_lab.folders[below(name)];
         return {};
     }
@@ -67,7 +69,7 @@ public:
             if ((!fault.name.isEmpty() && fault.name != remoteName) || !strikes(fault.times))
                 continue;
             if (fault.cutAfter < 0)
-                return refused(QStringLiteral("553 Could not create file."));
+                return refused(u"553 Could not create file."_s);
             m_lab.folders[m_here][remoteName] = content.left(fault.cutAfter);
             m_cut = true;
             return cut();
@@ -79,7 +81,7 @@ public:
     Result<void> get(const QString& remoteName, const HostPath& local) override {
         const FakeLab::Folder& folder = m_lab.folders[m_here];
         if (m_cut || !folder.contains(remoteName))
-            return m_cut ? cut() : refused(QStringLiteral("550 Failed to open file."));
+            return m_cut ? cut() : refused(u"550 Failed to open file."_s);
         const QByteArray& bytes = folder.at(remoteName);
         std::ofstream(local, std::ios::binary).write(bytes.constData(), bytes.size());
         return {};
@@ -90,7 +92,7 @@ public:
             return cut();
         m_lab.deletes += remoteName;
         if (m_lab.refusesDelete || m_lab.folders[m_here].erase(remoteName) == 0)
-            return refused(QStringLiteral("550 Delete operation failed."));
+            return refused(u"550 Delete operation failed."_s);
         return {};
     }
 
@@ -101,7 +103,7 @@ public:
         }
         std::vector<FtpEntry> entries;
         if (m_lab.listsDots)
-            entries = {{QStringLiteral("."), true}, {QStringLiteral(".."), true}};
+            entries = {{u"."_s, true}, {u".."_s, true}};
         const QString prefix = m_here.isEmpty() ? QString() : m_here + u'/';
         for (const auto& [path, folder] : m_lab.folders) {
             if (!path.isEmpty() && path.startsWith(prefix) && !path.mid(prefix.size()).contains(u'/'))
@@ -137,7 +139,7 @@ Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const
     if (strikes(deadConnects))
         return cut();
     if (strikes(refusedLogins))
-        return refused(QStringLiteral("530 Login incorrect."));
+        return refused(u"530 Login incorrect."_s);
     return std::unique_ptr<FtpConnection>(std::make_unique<FakeConnection>(*this));
 }
 

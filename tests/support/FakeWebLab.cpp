@@ -6,6 +6,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 bool strikes(int& counter) {
@@ -17,7 +19,7 @@ bool strikes(int& counter) {
 }
 
 Failure down() {
-    return {Failure::Kind::Disconnected, QStringLiteral("nobody answers")};
+    return {Failure::Kind::Disconnected, u"nobody answers"_s};
 }
 
 // The text between two marks.
@@ -34,21 +36,21 @@ QByteArray FakeWebLab::listOf(const QString& folder) const {
     QStringList entries{folder};
     for (const auto& [name, bytes] : uploads.at(folder))
         entries += name;
-    entries += QStringLiteral("total:%1").arg(entries.size() - 1);
-    return AnsiCodePage::encode(entries.join(QStringLiteral("~~")));
+    entries += u"total:%1"_s.arg(entries.size() - 1);
+    return AnsiCodePage::encode(entries.join(u"~~"_s));
 }
 
 Result<QByteArray> FakeWebLab::fetch(const QString& url) {
     urls += url;
     if (strikes(deadCalls))
         return down();
-    if (!url.contains(QStringLiteral("listfileb.php"))) {
+    if (!url.contains(u"listfileb.php"_s)) {
         reports += url;
         if (strikes(deadReports))
             return down();
         return QByteArray("OK");
     }
-    const QString folder = url.mid(url.indexOf(QStringLiteral("tik=")) + 4);
+    const QString folder = url.mid(url.indexOf(u"tik="_s) + 4);
     if (!uploads.contains(folder))
         return QByteArray("folder not found");
     m_listed.insert(folder);
@@ -59,13 +61,13 @@ Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& reque
     urls += url;
     posts.push_back(request);
     const QString head = AnsiCodePage::decode(request.body.left(400));
-    const QString name = between(head, QStringLiteral("filename=\""), QStringLiteral("\";"));
+    const QString name = between(head, u"filename=\""_s, u"\";"_s);
     posted += name;
     if (onPost)
         onPost(name);
     if (strikes(deadPosts))
         return down();
-    const QString folder = between(url, QStringLiteral("folder="), QStringLiteral("&"));
+    const QString folder = between(url, u"folder="_s, u"&"_s);
     const qsizetype from = request.body.indexOf("\r\n\r\n") + 4;
     const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
     uploads[folder];
@@ -78,9 +80,9 @@ Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {
     urls += url;
     if (strikes(deadCalls))
         return down();
-    const QString folder = between(url, QStringLiteral("/uploads/"), QStringLiteral("/filelist"));
+    const QString folder = between(url, u"/uploads/"_s, u"/filelist"_s);
     if (refusesLists || !m_listed.contains(folder))
-        return Failure{Failure::Kind::Refused, QStringLiteral("404")};
+        return Failure{Failure::Kind::Refused, u"404"_s};
     const QByteArray list = listOf(folder);
     std::ofstream(target, std::ios::binary).write(list.constData(), list.size());
     return {};

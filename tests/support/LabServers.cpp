@@ -11,6 +11,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 QString script(const char* name) {
     return QStringLiteral(LUMORA_LAB_SCRIPTS "/") + QLatin1String(name);
 }
@@ -60,8 +62,7 @@ LabServers::LabServers() {
     start.setProcessChannelMode(QProcess::MergedChannels);
     start.start(script("start"), {m_folder.path()});
     if (!start.waitForFinished(60'000) || start.exitStatus() != QProcess::NormalExit || start.exitCode() != 0) {
-        m_failure =
-            QStringLiteral("the lab did not start: %1 %2").arg(start.errorString(), QString::fromUtf8(start.readAll()));
+        m_failure = u"the lab did not start: %1 %2"_s.arg(start.errorString(), QString::fromUtf8(start.readAll()));
         return;
     }
     for (const QByteArray& line : linesOf(folder() / "ports")) {
@@ -69,7 +70,7 @@ LabServers::LabServers() {
         (line.startsWith("FTP") ? m_ftpPort : m_httpPort) = line.mid(sign + 1).toUShort();
     }
     if (m_ftpPort == 0 || m_httpPort == 0)
-        m_failure = QStringLiteral("the lab told no ports");
+        m_failure = u"the lab told no ports"_s;
 }
 
 LabServers::~LabServers() {
@@ -105,15 +106,13 @@ SecondFtpServer::SecondFtpServer() {
     for (int attempt = 0; attempt < 3; ++attempt) {
         m_port = FreePort();
         // Debian's own interpreter: another python in the path would not have the module.
-        m_server.start(QStringLiteral("/usr/bin/python3"),
-                       {QStringLiteral("-m"), QStringLiteral("pyftpdlib"), QStringLiteral("-i"),
-                        QStringLiteral("127.0.0.1"), QStringLiteral("-p"), QString::number(m_port),
-                        QStringLiteral("-w"), QStringLiteral("-d"), m_folder.path(), QStringLiteral("-u"), user(),
-                        QStringLiteral("-P"), password()});
+        m_server.start(u"/usr/bin/python3"_s,
+                       {u"-m"_s, u"pyftpdlib"_s, u"-i"_s, u"127.0.0.1"_s, u"-p"_s, QString::number(m_port), u"-w"_s,
+                        u"-d"_s, m_folder.path(), u"-u"_s, user(), u"-P"_s, password()});
         if (ComesUp(m_server, m_port))
             return;
     }
-    m_failure = QStringLiteral("pyftpdlib did not start: ") + QString::fromUtf8(m_server.readAll());
+    m_failure = u"pyftpdlib did not start: "_s + QString::fromUtf8(m_server.readAll());
 }
 
 SecondFtpServer::~SecondFtpServer() {
@@ -126,32 +125,29 @@ SecondFtpServer::~SecondFtpServer() {
 SecondWebServer::SecondWebServer() {
     std::filesystem::create_directory(uploads());
     m_server.setProcessChannelMode(QProcess::MergedChannels);
-    const QString configuration = m_folder.filePath(QStringLiteral("lighttpd.conf"));
+    const QString configuration = m_folder.filePath(u"lighttpd.conf"_s);
     for (int attempt = 0; attempt < 3; ++attempt) {
         m_port = FreePort();
         QFile file(configuration);
         if (!file.open(QIODevice::WriteOnly))
             break;
-        file.write(
-            QStringLiteral("server.modules = ( \"mod_alias\", \"mod_cgi\", \"mod_setenv\" )\n"
-                           "server.bind = \"127.0.0.1\"\n"
-                           "server.port = %1\n"
-                           "server.document-root = \"%2\"\n"
-                           "server.upload-dirs = ( \"%3\" )\n"
-                           "setenv.set-environment = ( \"LAB_FOLDER\" => \"%3\", \"REDIRECT_STATUS\" => \"200\" )\n"
-                           "alias.url = ( \"/hazmanot/uploads/\" => \"%3/uploads/\" )\n"
-                           "$HTTP[\"url\"] !~ \"^/hazmanot/uploads/\" {\n"
-                           "  cgi.assign = ( \".php\" => \"/usr/bin/php-cgi\", \".asp\" => \"/usr/bin/php-cgi\" )\n"
-                           "}\n")
-                .arg(QString::number(m_port), QStringLiteral(LUMORA_LAB_SCRIPTS "/www"), m_folder.path())
-                .toUtf8());
+        file.write(u"server.modules = ( \"mod_alias\", \"mod_cgi\", \"mod_setenv\" )\n"
+                   "server.bind = \"127.0.0.1\"\n"
+                   "server.port = %1\n"
+                   "server.document-root = \"%2\"\n"
+                   "server.upload-dirs = ( \"%3\" )\n"
+                   "setenv.set-environment = ( \"LAB_FOLDER\" => \"%3\", \"REDIRECT_STATUS\" => \"200\" )\n"
+                   "alias.url = ( \"/hazmanot/uploads/\" => \"%3/uploads/\" )\n"
+                   "$HTTP[\"url\"] !~ \"^/hazmanot/uploads/\" {\n"
+                   "  cgi.assign = ( \".php\" => \"/usr/bin/php-cgi\", \".asp\" => \"/usr/bin/php-cgi\" )\n"
+                   "}\n"_s.arg(QString::number(m_port), QStringLiteral(LUMORA_LAB_SCRIPTS "/www"), m_folder.path())
+                       .toUtf8());
         file.close();
-        m_server.start(QStringLiteral("/usr/sbin/lighttpd"),
-                       {QStringLiteral("-D"), QStringLiteral("-f"), configuration});
+        m_server.start(u"/usr/sbin/lighttpd"_s, {u"-D"_s, u"-f"_s, configuration});
         if (ComesUp(m_server, m_port))
             return;
     }
-    m_failure = QStringLiteral("lighttpd did not start: ") + QString::fromUtf8(m_server.readAll());
+    m_failure = u"lighttpd did not start: "_s + QString::fromUtf8(m_server.readAll());
 }
 
 SecondWebServer::~SecondWebServer() {

@@ -9,6 +9,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // Real servers of a lab over a temporary folder, on free ports of 127.0.0.1, ended with this object. The ordinary kind
 // is the demo's own lab: vsftpd and nginx with php-cgi. A test asserts running() and so fails, and never skips, where a
 // server could not start.
@@ -22,21 +24,21 @@ public:
     bool running() const { return m_failure.isEmpty(); }
     QString failure() const { return m_failure; }
 
-    QString ftpHost() const { return QStringLiteral("127.0.0.1:%1").arg(m_ftpPort); }
+    QString ftpHost() const { return u"127.0.0.1:%1"_s.arg(m_ftpPort); }
     quint16 ftpPort() const { return m_ftpPort; }
-    static QString user() { return QStringLiteral("ftp"); }
-    static QString password() { return QStringLiteral("loopback-lab"); }
+    static QString user() { return u"ftp"_s; }
+    static QString password() { return u"loopback-lab"_s; }
 
     quint16 httpPort() const { return m_httpPort; }
     // "http://127.0.0.1:PORT", without a slash at its end.
-    QString site() const { return QStringLiteral("http://127.0.0.1:%1").arg(m_httpPort); }
+    QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_httpPort); }
 
     // What the account sees as "/", and the folder that orders arrive in.
     HostPath account() const { return folder() / "ftp"; }
     HostPath ordersFolder() const { return account() / "zalamim234"; }
     // The folder that orders arrive in which come by HTTP, and the lab's site folder for them.
     HostPath uploads() const { return folder() / "uploads"; }
-    static QString siteFolder() { return QStringLiteral("hazmanot"); }
+    static QString siteFolder() { return u"hazmanot"_s; }
     HostPath folder() const { return toHostPath(m_folder.path()); }
     HostPath labFile() const { return folder() / "lab.ini"; }
 
@@ -65,9 +67,9 @@ public:
 
     bool running() const { return m_failure.isEmpty(); }
     QString failure() const { return m_failure; }
-    QString ftpHost() const { return QStringLiteral("127.0.0.1:%1").arg(m_port); }
-    static QString user() { return QStringLiteral("lumora"); }
-    static QString password() { return QStringLiteral("second-lab"); }
+    QString ftpHost() const { return u"127.0.0.1:%1"_s.arg(m_port); }
+    static QString user() { return u"lumora"_s; }
+    static QString password() { return u"second-lab"_s; }
     HostPath account() const { return toHostPath(m_folder.path()); }
 
 private:
@@ -87,7 +89,7 @@ public:
 
     bool running() const { return m_failure.isEmpty(); }
     QString failure() const { return m_failure; }
-    QString site() const { return QStringLiteral("http://127.0.0.1:%1").arg(m_port); }
+    QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_port); }
     HostPath uploads() const { return toHostPath(m_folder.path()) / "uploads"; }
 
 private:

@@ -11,9 +11,11 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // A server that takes mail for others is started by root and nobody else; it works on as a user of its own.
 QStringList asRoot(const QStringList& command) {
-    return ::geteuid() == 0 ? command : QStringList{QStringLiteral("sudo"), QStringLiteral("-n")} + command;
+    return ::geteuid() == 0 ? command : QStringList{u"sudo"_s, u"-n"_s} + command;
 }
 
 QByteArray outputOf(QStringList command) {
@@ -98,14 +100,13 @@ MailServer::MailServer(Disk disk, Encryption encryption) {
         m_port = FreePort();
         m_tlsPort = FreePort();
         const QString file = configure(disk, encryption);
-        QStringList command =
-            asRoot({QStringLiteral("/usr/sbin/exim4"), QStringLiteral("-C"), file, QStringLiteral("-bdf")});
+        QStringList command = asRoot({u"/usr/sbin/exim4"_s, u"-C"_s, file, u"-bdf"_s});
         const QString program = command.takeFirst();
         m_server.start(program, command);
         if (ComesUp(m_server, m_port) && ComesUp(m_server, m_tlsPort))
             return;
     }
-    m_failure = QStringLiteral("exim4 did not start: ") + QString::fromUtf8(m_server.readAll());
+    m_failure = u"exim4 did not start: "_s + QString::fromUtf8(m_server.readAll());
 }
 
 MailServer::~MailServer() {
@@ -116,44 +117,42 @@ MailServer::~MailServer() {
         m_server.waitForFinished(5'000);
     }
     // What the server's user has made is beyond the temporary folder's own removal.
-    outputOf(asRoot({QStringLiteral("rm"), QStringLiteral("-rf"), m_folder.path()}));
+    outputOf(asRoot({u"rm"_s, u"-rf"_s, m_folder.path()}));
 }
 
 QString MailServer::configure(Disk disk, Encryption encryption) const {
-    const QString path = m_folder.filePath(QStringLiteral("exim.conf"));
+    const QString path = m_folder.filePath(u"exim.conf"_s);
     const MailAccount known = account();
     QString text = QLatin1String(configuration);
-    text.replace(QStringLiteral("%1"), m_folder.path());
-    text.replace(QStringLiteral("%2"), QString::number(m_port));
-    text.replace(QStringLiteral("%3"), QString::number(m_tlsPort));
-    text.replace(QStringLiteral("%4"), encryption == Encryption::Offered ? QStringLiteral("*") : QString());
-    text.replace(QStringLiteral("%5"), QString::number(largestMessage));
+    text.replace(u"%1"_s, m_folder.path());
+    text.replace(u"%2"_s, QString::number(m_port));
+    text.replace(u"%3"_s, QString::number(m_tlsPort));
+    text.replace(u"%4"_s, encryption == Encryption::Offered ? u"*"_s : QString());
+    text.replace(u"%5"_s, QString::number(largestMessage));
     // No disk has so much room left as the full one asks for.
-    text.replace(QStringLiteral("%6"), disk == Disk::Full ? QStringLiteral("1000000G") : QStringLiteral("0"));
-    text.replace(QStringLiteral("%7"), known.user);
-    text.replace(QStringLiteral("%8"), known.password);
+    text.replace(u"%6"_s, disk == Disk::Full ? u"1000000G"_s : u"0"_s);
+    text.replace(u"%7"_s, known.user);
+    text.replace(u"%8"_s, known.password);
     QFile file(path);
     if (file.open(QIODevice::WriteOnly | QIODevice::Truncate))
         file.write(text.toUtf8());
     file.close();
     // It takes only a file of the user who starts it, and that no other may write to.
     file.setPermissions(static_cast<QFile::Permissions>(0x6644));
-    outputOf(asRoot({QStringLiteral("chown"), QStringLiteral("root"), path}));
+    outputOf(asRoot({u"chown"_s, u"root"_s, path}));
     return path;
 }
 
 bool MailServer::makeCertificate() {
-    const QString key = m_folder.filePath(QStringLiteral("key.pem"));
+    const QString key = m_folder.filePath(u"key.pem"_s);
     QProcess openssl;
     openssl.setProcessChannelMode(QProcess::MergedChannels);
-    openssl.start(QStringLiteral("/usr/bin/openssl"),
-                  {QStringLiteral("req"), QStringLiteral("-x509"), QStringLiteral("-newkey"), QStringLiteral("ec"),
-                   QStringLiteral("-pkeyopt"), QStringLiteral("ec_paramgen_curve:prime256v1"), QStringLiteral("-nodes"),
-                   QStringLiteral("-days"), QStringLiteral("2"), QStringLiteral("-subj"), QStringLiteral("/CN=lab"),
-                   QStringLiteral("-addext"), QStringLiteral("subjectAltName=IP:127.0.0.1"), QStringLiteral("-keyout"),
-                   key, QStringLiteral("-out"), authority()});
+    openssl.start(u"/usr/bin/openssl"_s,
+                  {u"req"_s, u"-x509"_s, u"-newkey"_s, u"ec"_s, u"-pkeyopt"_s, u"ec_paramgen_curve:prime256v1"_s,
+                   u"-nodes"_s, u"-days"_s, u"2"_s, u"-subj"_s, u"/CN=lab"_s, u"-addext"_s,
+                   u"subjectAltName=IP:127.0.0.1"_s, u"-keyout"_s, key, u"-out"_s, authority()});
     if (!openssl.waitForFinished(20'000) || openssl.exitCode() != 0) {
-        m_failure = QStringLiteral("openssl made no certificate: ") + QString::fromUtf8(openssl.readAll());
+        m_failure = u"openssl made no certificate: "_s + QString::fromUtf8(openssl.readAll());
         return false;
     }
     return QFile::setPermissions(key, static_cast<QFile::Permissions>(0x6644));
@@ -161,13 +160,13 @@ bool MailServer::makeCertificate() {
 
 MailAccount MailServer::account(MailEncryption encryption) const {
     MailAccount account;
-    account.host = QStringLiteral("127.0.0.1");
+    account.host = u"127.0.0.1"_s;
     account.port = encryption == MailEncryption::Tls ? m_tlsPort : m_port;
     account.encryption = encryption;
-    account.user = QStringLiteral("kiosk");
-    account.password = QStringLiteral("loopback lab");
-    account.from = QStringLiteral("kiosk@shop.example");
-    account.to = QStringLiteral("orders@lab.example");
+    account.user = u"kiosk"_s;
+    account.password = u"loopback lab"_s;
+    account.from = u"kiosk@shop.example"_s;
+    account.to = u"orders@lab.example"_s;
     return account;
 }
 
@@ -177,11 +176,11 @@ QByteArray MailServer::mailbox() const {
     waiting.start();
     while (waiting.elapsed() < 5'000 && log().count(" <= ") > log().count(" Completed\n"))
         QThread::msleep(20);
-    return outputOf(asRoot({QStringLiteral("cat"), m_folder.filePath(QStringLiteral("box/orders"))}));
+    return outputOf(asRoot({u"cat"_s, m_folder.filePath(u"box/orders"_s)}));
 }
 
 QByteArray MailServer::log() const {
-    return outputOf(asRoot({QStringLiteral("cat"), m_folder.filePath(QStringLiteral("log/mainlog"))}));
+    return outputOf(asRoot({u"cat"_s, m_folder.filePath(u"log/mainlog"_s)}));
 }
 
 } // namespace lumora

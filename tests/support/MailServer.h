@@ -8,6 +8,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // A real mail server (exim) over a temporary folder, on free ports of 127.0.0.1, ended with this object. It serves the
 // lab's one mailbox to those who log in. A test asserts running() and so fails, and never skips, where it could not
 // start.
@@ -28,7 +30,7 @@ public:
     // Whole messages above this many bytes are refused.
     static constexpr int largestMessage = 6 * 1024 * 1024;
     // The authority that has signed the server's certificate, which names 127.0.0.1 and nothing else.
-    QString authority() const { return m_folder.filePath(QStringLiteral("authority.pem")); }
+    QString authority() const { return m_folder.filePath(u"authority.pem"_s); }
 
     // The messages in the mailbox, one behind the other, with all that the server has taken so far.
     QByteArray mailbox() const;

@@ -86,7 +86,7 @@ class FixedVolume : public Volume {
 public:
     Result<std::int32_t> serial(const QString&) const override {
         if (fails)
-            return Failure{Failure::Kind::Other, QStringLiteral("no serial")};
+            return Failure{Failure::Kind::Other, u"no serial"_s};
         return number;
     }
     std::int32_t number = -987651234;
@@ -107,7 +107,7 @@ public:
     Result<void> download(const QString&, const HostPath&) override { return noLine(); }
 
 private:
-    static Failure noLine() { return {Failure::Kind::Disconnected, QStringLiteral("no line")}; }
+    static Failure noLine() { return {Failure::Kind::Disconnected, u"no line"_s}; }
 };
 
 class RecordedMail : public Mail {

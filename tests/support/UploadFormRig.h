@@ -15,19 +15,18 @@ public:
     explicit UploadFormRig(Internet& line)
         : test(line)
         , chain(test.pump) {
-        state.DiskRoot = QStringLiteral("C:\\");
+        state.DiskRoot = u"C:\\"_s;
         state.transfer.OrderFolder = folder();
         state.transfer.SugSheliach = 1;
         ClientProfile& profile = state.profile;
-        profile.ClientCode = QStringLiteral("tarvelmond");
-        profile.LabPhone = QStringLiteral("00-0000000");
-        profile.HttpHost = QStringLiteral("http://192.0.2.10");
-        profile.HttpTikiya = QStringLiteral("hazmanot");
-        profile.HttpScriptPath = QStringLiteral("/hazmanot/");
-        profile.ReportUrl = QStringLiteral("http://192.0.2.10/aaaqamootreport/padd.asp");
-        profile.HttpDoneUrl = QStringLiteral("http://192.0.2.11/aaasssppp/p.asp");
-        for (const QString& path :
-             {QStringLiteral("C:\\2000lumora"), QStringLiteral("C:\\2000lumora\\!!000"), folder()})
+        profile.ClientCode = u"tarvelmond"_s;
+        profile.LabPhone = u"00-0000000"_s;
+        profile.HttpHost = u"http://192.0.2.10"_s;
+        profile.HttpTikiya = u"hazmanot"_s;
+        profile.HttpScriptPath = u"/hazmanot/"_s;
+        profile.ReportUrl = u"http://192.0.2.10/aaaqamootreport/padd.asp"_s;
+        profile.HttpDoneUrl = u"http://192.0.2.11/aaasssppp/p.asp"_s;
+        for (const QString& path : {u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s, folder()})
             (void)test.files.makeFolder(path);
         write(log(), "the order");
         write(sheet(), QByteArray(900, 's'));
@@ -38,14 +37,14 @@ public:
                            [this] { return std::make_unique<UploadForm>(state, test.platform, chain); });
     }
 
-    static QString name() { return QStringLiteral("2026_11_21_KUP_1234^105"); }
-    static QString folder() { return QStringLiteral("C:\\2000lumora\\!!000\\") + name(); }
-    static QString log() { return name() + QStringLiteral(".txt"); }
-    static QString sheet() { return QStringLiteral("!105_1234.jpg"); }
-    static QString first() { return QStringLiteral("021015GNB0000_03AABB.jpp"); }
-    static QString second() { return QStringLiteral("111015GNB0001_03AACC.jpp"); }
-    static QString third() { return QStringLiteral("211015GNB0002_03AADD.jpp"); }
-    static QString list() { return QStringLiteral("filelisthom.txt"); }
+    static QString name() { return u"2026_11_21_KUP_1234^105"_s; }
+    static QString folder() { return u"C:\\2000lumora\\!!000\\"_s + name(); }
+    static QString log() { return name() + u".txt"_s; }
+    static QString sheet() { return u"!105_1234.jpg"_s; }
+    static QString first() { return u"021015GNB0000_03AABB.jpp"_s; }
+    static QString second() { return u"111015GNB0001_03AACC.jpp"_s; }
+    static QString third() { return u"211015GNB0002_03AADD.jpp"_s; }
+    static QString list() { return u"filelisthom.txt"_s; }
 
     void write(const QString& leaf, const QByteArray& bytes) {
         (void)test.files.writeWhole(folder() + u'\\' + leaf, bytes);
@@ -53,7 +52,7 @@ public:
     // The order without the list that was fetched.
     std::map<QString, QByteArray> localFiles() const {
         std::map<QString, QByteArray> bytes;
-        for (const QString& leaf : test.files.names(folder(), QStringLiteral("*.*"))) {
+        for (const QString& leaf : test.files.names(folder(), u"*.*"_s)) {
             if (leaf != list())
                 bytes[leaf] = *test.files.read(folder() + u'\\' + leaf);
         }

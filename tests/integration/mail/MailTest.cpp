@@ -16,6 +16,8 @@
 namespace lumora {
 namespace {
 
+using namespace Qt::StringLiterals;
+
 // What a mail program finds in the last message of a mailbox: four files in the folder.
 const char* const mailProgram = R"(
 import mailbox, sys, os
@@ -43,9 +45,9 @@ QByteArray contentOf(const QString& path) {
 class MailTest : public testing::Test {
 protected:
     MailTest() {
-        message.subject = QStringLiteral("הזמנה של סבתא רבקה כהן-לוי, 21 בנובמבר, שלושים תמונות 10/15");
-        message.body = QStringLiteral("רבקה כהן-לוי\n03-5551234\n.\nFrom the sea, no. 5\n");
-        message.attachment = fileOf(3 << 20, QStringLiteral("תמונה של \"הים\" 001.jpp"));
+        message.subject = u"הזמנה של סבתא רבקה כהן-לוי, 21 בנובמבר, שלושים תמונות 10/15"_s;
+        message.body = u"רבקה כהן-לוי\n03-5551234\n.\nFrom the sea, no. 5\n"_s;
+        message.attachment = fileOf(3 << 20, u"תמונה של \"הים\" 001.jpp"_s);
     }
     ~MailTest() override { qunsetenv("SSL_CERT_FILE"); }
 
@@ -81,22 +83,21 @@ TEST_F(MailTest, AFileArrivesByteForByteWithSubjectBodyAndName) {
     for (const MailEncryption encryption : {MailEncryption::None, MailEncryption::StartTls, MailEncryption::Tls}) {
         const MailOutcome outcome = mail.send(server.account(encryption), message);
         ASSERT_EQ(outcome.end, MailEnd::Sent) << int(encryption) << outcome.words.toStdString();
-        const QString box = folder.filePath(QStringLiteral("box"));
+        const QString box = folder.filePath(u"box"_s);
         QFile file(box);
         ASSERT_TRUE(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
         file.write(server.mailbox());
         file.close();
         QProcess reading;
         reading.setProcessChannelMode(QProcess::MergedChannels);
-        reading.start(QStringLiteral("/usr/bin/python3"),
-                      {QStringLiteral("-c"), QString::fromUtf8(mailProgram), box, folder.path()});
+        reading.start(u"/usr/bin/python3"_s, {u"-c"_s, QString::fromUtf8(mailProgram), box, folder.path()});
         ASSERT_TRUE(reading.waitForFinished(20'000));
         ASSERT_EQ(reading.exitCode(), 0) << reading.readAll().toStdString();
-        EXPECT_EQ(contentOf(folder.filePath(QStringLiteral("subject"))), message.subject.toUtf8());
-        EXPECT_EQ(QString::fromUtf8(contentOf(folder.filePath(QStringLiteral("body")))).remove(u'\r'), message.body);
-        EXPECT_EQ(contentOf(folder.filePath(QStringLiteral("name"))), toText(message.attachment.filename()).toUtf8());
-        EXPECT_TRUE(contentOf(folder.filePath(QStringLiteral("file"))) == contentOf(toText(message.attachment)));
-        QFile::remove(folder.filePath(QStringLiteral("file")));
+        EXPECT_EQ(contentOf(folder.filePath(u"subject"_s)), message.subject.toUtf8());
+        EXPECT_EQ(QString::fromUtf8(contentOf(folder.filePath(u"body"_s))).remove(u'\r'), message.body);
+        EXPECT_EQ(contentOf(folder.filePath(u"name"_s)), toText(message.attachment.filename()).toUtf8());
+        EXPECT_TRUE(contentOf(folder.filePath(u"file"_s)) == contentOf(toText(message.attachment)));
+        QFile::remove(folder.filePath(u"file"_s));
     }
     // Encrypted where that was asked for, and logged in each time.
     const QByteArray log = server.log();
@@ -112,28 +113,26 @@ TEST_F(MailTest, EachRefusalHasItsCode) {
     ASSERT_TRUE(server.running() && full.running()) << (server.failure() + full.failure()).toStdString();
 
     MailAccount wrong = server.account();
-    wrong.to = QStringLiteral("nobody@lab.example");
-    expectEnd(14, wrong, "Unrouteable",
-              QStringLiteral("השם שהוקלד בחלונית הכתובת אינו מדוייק על כן הקלד כתובת במדוייק"));
+    wrong.to = u"nobody@lab.example"_s;
+    expectEnd(14, wrong, "Unrouteable", u"השם שהוקלד בחלונית הכתובת אינו מדוייק על כן הקלד כתובת במדוייק"_s);
     wrong = server.account();
-    wrong.to = QStringLiteral("orders@lab.example>\r\nRCPT TO:<else@else.example");
+    wrong.to = u"orders@lab.example>\r\nRCPT TO:<else@else.example"_s;
     expectEnd(14, wrong, "no mail address");
     wrong = server.account();
-    wrong.password = QStringLiteral("guessed");
-    expectEnd(6, wrong, "535", QStringLiteral("הגישה נדחתה"));
+    wrong.password = u"guessed"_s;
+    expectEnd(6, wrong, "535", u"הגישה נדחתה"_s);
     EXPECT_FALSE(mail.send(wrong, message).words.contains(wrong.password));
-    expectEnd(4, full.account(), "452", QStringLiteral("הדיסק ללא מקופ פנוי המספיק לביצוע המשלוח"));
+    expectEnd(4, full.account(), "452", u"הדיסק ללא מקופ פנוי המספיק לביצוע המשלוח"_s);
     wrong = server.account();
     wrong.port = FreePort();
-    expectEnd(3, wrong, "refused",
-              QStringLiteral(" תוכנת הדואר לא הוגדרה כראוי") + QStringLiteral("המחשב לא יצר קשר עם שרת הדואר שלך"));
+    expectEnd(3, wrong, "refused", u" תוכנת הדואר לא הוגדרה כראוי"_s + u"המחשב לא יצר קשר עם שרת הדואר שלך"_s);
 
-    message.attachment = fileOf(MailServer::largestMessage, QStringLiteral("large.jpp"));
-    expectEnd(18, server.account(), "552", QStringLiteral("התוכן המילולי ארוך מדי לא נשלחה ההודעה"));
-    message.attachment = toHostPath(folder.filePath(QStringLiteral("gone.jpp")));
-    expectEnd(11, server.account(), "gone.jpp", QStringLiteral("הקובץ המיועד לשיגור אינו נמצא"));
+    message.attachment = fileOf(MailServer::largestMessage, u"large.jpp"_s);
+    expectEnd(18, server.account(), "552", u"התוכן המילולי ארוך מדי לא נשלחה ההודעה"_s);
+    message.attachment = toHostPath(folder.filePath(u"gone.jpp"_s));
+    expectEnd(11, server.account(), "gone.jpp", u"הקובץ המיועד לשיגור אינו נמצא"_s);
     message.attachment = toHostPath(folder.path());
-    expectEnd(12, server.account(), "", QStringLiteral("הקובץ המיועד לשיגור אינו תקין ואינו ראוי למשלוח"));
+    expectEnd(12, server.account(), "", u"הקובץ המיועד לשיגור אינו תקין ואינו ראוי למשלוח"_s);
 
     EXPECT_TRUE((server.mailbox() + full.mailbox()).isEmpty());
 }
@@ -148,7 +147,7 @@ TEST_F(MailTest, NothingGoesToAServerThatIsNotProved) {
     qputenv("SSL_CERT_FILE", server.authority().toLocal8Bit());
     for (const MailEncryption encryption : {MailEncryption::StartTls, MailEncryption::Tls}) {
         MailAccount renamed = server.account(encryption);
-        renamed.host = QStringLiteral("localhost");
+        renamed.host = u"localhost"_s;
         expectEnd(3, renamed, "ertificate");
     }
     expectEnd(3, open.account(MailEncryption::StartTls), "no encryption");
@@ -194,10 +193,10 @@ TEST_F(MailTest, AServerThatFallsSilentOrLeavesIsNoContact) {
                                      ScriptedServer::Then then) {
         const ScriptedServer server(replies, then);
         MailAccount account;
-        account.host = QStringLiteral("127.0.0.1");
+        account.host = u"127.0.0.1"_s;
         account.port = server.port();
         account.encryption = encryption;
-        account.from = account.to = QStringLiteral("a@lab.example");
+        account.from = account.to = u"a@lab.example"_s;
         QElapsedTimer time;
         time.start();
         expectEnd(3, account, "");
