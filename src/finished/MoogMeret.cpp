@@ -141,10 +141,17 @@ void MoogMeret::showOrder(const QString& folder) {
     Label1.text = QString::number(File1.names().count());
     Label4Reka.visible = File1.names().isEmpty();
     Label4Pieces.visible = m_state.transfer.Mefurak > 0;
+    showWhatIsMarked();
     const OrderDetails details = detailsOf(folder);
-    Label4Lakoach.text = m_state.wording(QStringLiteral("לקוח: %1 %2"), QStringLiteral("Customer: %1 %2"))
-                             .arg(details.n1, details.n2)
-                             .trimmed();
+    const QString customer = QString(details.n1 + u' ' + details.n2).trimmed();
+    Label4Lakoach.visible = !customer.isEmpty();
+    Label4Lakoach.text = m_state.wording(QStringLiteral("לקוח: %1"), QStringLiteral("Customer: %1")).arg(customer);
+    QStringList unreadable;
+    m_platform.files.collect(folder, Files::Depth::ThisFolder, &unreadable);
+    if (!unreadable.isEmpty())
+        m_platform.dialogs.message(m_state.wording(QStringLiteral("אין אפשרות לקרוא תיקייה זו:"),
+                                                   QStringLiteral("This folder can't be read:")) +
+                                   u'\n' + unreadable.join(u'\n'));
 }
 
 // A first file that is no picture, as a print file or a piece, leaves the window empty.

@@ -138,6 +138,7 @@ private:
     void ShowFamilyCount();
     void loadPreview();
     void showOrder(const QString& folder);
+    void showWhatIsMarked();
     void showSendButtons(bool shown);
     void selectPackage(int index);
     void sendPackage(int index);

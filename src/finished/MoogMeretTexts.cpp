@@ -18,8 +18,7 @@ void MoogMeret::setTexts() {
         QStringLiteral("Step two: which files? A touch marks a file, or takes its mark away."));
     set(Label4Files, QStringLiteral("קבצים בהזמנה"), QStringLiteral("files in this order"));
     set(Label4Prints, QStringLiteral("תמונות בקבצים שסומנו"), QStringLiteral("pictures in the marked files"));
-    set(Label4Pieces, QStringLiteral("ההזמנה נשלחת בחלקים: מסומנים החלקים (prk) ודף ההזמנה."),
-        QStringLiteral("The order travels in pieces: the pieces (prk) and the order sheet are marked."));
+    showWhatIsMarked();
     set(Label4Reka, QStringLiteral("אין בהזמנה זו קבצים לשליחה."),
         QStringLiteral("This order has no files that can be sent."));
     set(Label4Shalav3, QStringLiteral("שלב שלישי: איך לשלוח?"), QStringLiteral("Step three: how to send?"));
@@ -44,6 +43,19 @@ void MoogMeret::setTexts() {
         QStringLiteral("The exit button will work after all the packages are sent"));
     showWalk();
     showOutcome();
+}
+
+void MoogMeret::showWhatIsMarked() {
+    Label4Pieces.text =
+        List3.currentIndex() >= 0 && !TravelsInPieces(List3.currentItem())
+            ? m_state.wording(
+                  QStringLiteral("לאחר הזמנה בחלקים מסומנים רק חלקים (prk) ודף ההזמנה. את שאר הקבצים לשליחה "
+                                 "יש לסמן בנגיעה."),
+                  QStringLiteral("After an order in pieces only pieces (prk) and the order sheet are marked. "
+                                 "Touch the other files that are to be sent."))
+            : m_state.wording(QStringLiteral("ההזמנה נשלחת בחלקים: מסומנים החלקים (prk) ודף ההזמנה."),
+                              QStringLiteral("The order travels in pieces: the pieces (prk) and the order sheet are "
+                                             "marked."));
 }
 
 } // namespace lumora

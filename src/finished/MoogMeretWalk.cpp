@@ -184,7 +184,9 @@ void MoogMeret::sendPackage(int index) {
 
 OrderDetails MoogMeret::detailsOf(const QString& folder) const {
     OrderDetails details;
-    ReadResentDetails(m_platform.files, JoinDrivePath(folder, LeafName(folder) + QStringLiteral(".txt")), details);
+    const QString text = JoinDrivePath(folder, LeafName(folder) + QStringLiteral(".txt"));
+    if (m_platform.files.fileExists(text))
+        ReadResentDetails(m_platform.files, text, details);
     return details;
 }
 

@@ -96,6 +96,7 @@ void SpltForm::Command2_Click() {
     const QString path = pickFile();
     if (path.isEmpty())
         return;
+    forgetOutcome();
     List4files.clear();
     List4files.append(collect(m_folder, Files::Depth::ThisFolder));
     showWhatCanBeDone();
@@ -174,6 +175,7 @@ void SpltForm::Command8_Click() {
     const QString path = pickFile();
     if (path.isEmpty())
         return;
+    forgetOutcome();
     List4files.clear();
     ListChalakim.append(collect(m_folder, Files::Depth::WithSubfolders));
     ListSingles(ListChalakim, List4Bodedim);
@@ -351,10 +353,14 @@ void SpltForm::begin() {
     busy = true;
     m_stop = false;
     percent = 0;
+    forgetOutcome();
+    showWhatCanBeDone();
+}
+
+void SpltForm::forgetOutcome() {
     outcome = Outcome::None;
     Label4Total.text.clear();
     Label4Where.text.clear();
-    showWhatCanBeDone();
 }
 
 void SpltForm::workOn(const QString& path, int index, int count) {

@@ -92,6 +92,7 @@ private:
 
     bool segmentIsRight();
     void begin();
+    void forgetOutcome();
     void workOn(const QString& path, int index, int count);
     bool step(int done, int total);
     void end(Outcome result, const QString& total, const QString& where);

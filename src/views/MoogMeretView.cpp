@@ -252,7 +252,7 @@ void MoogMeretView::render() {
         QListWidgetItem* item = m_orders->item(row);
         const bool inPieces = TravelsInPieces(m_page.List3.item(row));
         item->setIcon(theme().icon(inPieces ? u"layers"_s : u"pictures"_s, size, Theme::Colour::Primary));
-        item->setToolTip(inPieces ? m_page.Label4Pieces.text : QString());
+        item->setToolTip(inPieces ? wording(u"הזמנה בחלקים"_s, u"An order in pieces"_s) : QString());
     }
     if (picked)
         renderFiles();

@@ -42,6 +42,10 @@ void ScrolledPicture::setScroll(QPoint value, QPoint max) {
     setVerticalScrollBarPolicy(max.y() > 0 ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
     set(*horizontalScrollBar(), value.x(), max.x());
     set(*verticalScrollBar(), value.y(), max.y());
+    // A bar that can't be moved says nothing.
+    const auto policy = [](int last) { return last > 0 ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff; };
+    setHorizontalScrollBarPolicy(policy(max.x()));
+    setVerticalScrollBarPolicy(policy(max.y()));
     viewport()->update();
 }
 

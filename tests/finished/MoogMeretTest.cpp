@@ -120,6 +120,8 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
         EXPECT_EQ(page.Label5.text, QString::number(c.pictures));
         EXPECT_EQ(state.shemot.TotalPics, c.pictures);
         EXPECT_EQ(state.transfer.Mefurak, c.Mefurak);
+        EXPECT_EQ(page.Label4Pieces.visible, c.Mefurak > 0);
+        EXPECT_EQ(page.Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order != whole || c.Mefurak == 0);
     }
     EXPECT_EQ(page.Label4Lakoach.text, u"לקוח: דנה לוי 03-1234567");
     page.File1_Click(0);
@@ -135,6 +137,7 @@ TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     MoogMeret& page = startWith(empty);
     EXPECT_EQ(page.Label1.text, u"0");
     EXPECT_TRUE(page.Label4Reka.visible);
+    EXPECT_FALSE(page.Label4Lakoach.visible) << "no text tells whose it is";
     EXPECT_TRUE(page.Picture1.isNull());
     page.Command4_Click();
     page.Command2_Click();
@@ -144,6 +147,8 @@ TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     EXPECT_EQ(chain.front(), &page);
 
     std::filesystem::remove_all(*test.drives.toHost(orders));
+    page.List3_Click(1);
+    EXPECT_TRUE(test.dialogs.messages.last().contains(page.List2.item(1))) << "gone since it was listed";
     page.Command5_Click();
     EXPECT_TRUE(page.Label4Rek.visible);
     EXPECT_FALSE(page.Picture2.visible);
