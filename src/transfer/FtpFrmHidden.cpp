@@ -25,6 +25,11 @@ bool isSheet(const QString& path) {
 void FtpFrm::Command2_Click() {
     if (sending || AllDone == 1)
         return;
+    // The proof picture alone would arrive and count as the whole order.
+    if (m_handedOver.isEmpty()) {
+        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        return;
+    }
     List3.clear();
     if (m_state.transfer.Mefurak < 1) {
         List3.append(m_handedOver);
@@ -50,6 +55,10 @@ void FtpFrm::Command2_Click() {
 void FtpFrm::Command4_Click() {
     if (sending || AllDone == 1 || m_room->desk.left)
         return;
+    if (List3.isEmpty()) {
+        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        return;
+    }
     UploadRoom& room = *m_room;
     Phase end = Phase::Silent;
     room.session.beginPass();

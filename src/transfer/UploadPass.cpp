@@ -19,6 +19,8 @@ void UploadPass::run() {
     m_board.Image6.visible = false;
     m_session.beginPass();
     m_desk.StopFlag = false;
+    // The pause since an earlier pass is no pace of the line.
+    LastPartTime = {};
     for (int i = 0; i < m_board.List3.count() && !m_desk.StopFlag && !m_desk.left; ++i) {
         m_board.List3.setCurrentIndex(i);
         CurrentIndex = i;

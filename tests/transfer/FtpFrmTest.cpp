@@ -470,6 +470,15 @@ TEST_F(FtpFrmTest, TheOlderBulkPathSendsInRounds) {
     EXPECT_EQ(lab.urls.size(), 3);
 }
 
+TEST_F(FtpFrmTest, TheOlderBulkPathSendsNothingWhereNoListWasHandedOver) {
+    FtpFrm& page = rig.start();
+    const QStringList order = page.List3.items();
+    page.Command2_Click();
+    EXPECT_EQ(rig.test.dialogs.messages, QStringList(u"list3 is empty"_s));
+    EXPECT_EQ(page.List3.items(), order);
+    EXPECT_EQ(lab.urls.size(), 0) << "no report of an order that did not go";
+}
+
 TEST_F(FtpFrmTest, TheManualPanelPutsGetsAndDeletes) {
     FtpFrm& page = rig.start();
     page.Command3_Click();
