@@ -222,7 +222,9 @@ ScenarioPlayer::Look ScenarioPlayer::lookForMessage(const QString& wanted) {
     const QString said = QStringLiteral("the message ") + quoted(wanted);
     if (m_messagesTaken >= shown.size())
         return {false, said, QStringLiteral("no message"), patienceOfMessage};
-    const QString& oldest = shown[m_messagesTaken++];
+    // Some of the texts end their lines with a carriage return, which no scenario can write.
+    QString oldest = shown[m_messagesTaken++];
+    oldest.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n');
     return {oldest == wanted, said, quoted(oldest)};
 }
 
