@@ -17,6 +17,12 @@
 
 namespace lumora {
 
+namespace {
+
+constexpr int troublesTold = 2;
+
+} // namespace
+
 SpltForm::SpltForm(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::SpltForm)
     , m_state(state)
@@ -163,9 +169,11 @@ void SpltForm::Command9_Click() {
         end(result.failure   ? Outcome::Failed
             : result.stopped ? Outcome::Partly
                              : Outcome::Good,
-            wording(QStringLiteral("%1 נחתך. חלקים: %2."), QStringLiteral("%1 was cut. Pieces: %2."))
-                .arg(LeafName(path))
-                .arg(result.pieces),
+            (result.failure || result.stopped
+                 ? wording(QStringLiteral("%1 לא נחתך עד הסוף. חלקים: %2."),
+                           QStringLiteral("%1 was not cut to its end. Pieces: %2."))
+                 : wording(QStringLiteral("%1 נחתך. חלקים: %2."), QStringLiteral("%1 was cut. Pieces: %2.")))
+                .arg(LeafName(path), QString::number(result.pieces)),
             result.pieces > 0 ? result.folder : QString());
 }
 
@@ -283,9 +291,7 @@ void SpltForm::Command4_Click() {
     }
     QString total = wording(QStringLiteral("%1 צורף. חלקים: %2, בתים: %3."),
                             QStringLiteral("%1 was joined. Pieces: %2, bytes: %3."))
-                        .arg(LeafName(result.file))
-                        .arg(result.pieces)
-                        .arg(result.bytes);
+                        .arg(LeafName(result.file), QString::number(result.pieces), QString::number(result.bytes));
     // The declared total of an exact multiple is one too many; whether this file is whole no name can tell.
     if (result.pieces != result.declared)
         total += wording(QStringLiteral(" בשם רשומים %1 חלקים: יש לבדוק שהקובץ שלם."),
@@ -353,6 +359,7 @@ void SpltForm::begin() {
     busy = true;
     m_stop = false;
     percent = 0;
+    m_troubles.clear();
     forgetOutcome();
     showWhatCanBeDone();
 }
@@ -391,8 +398,20 @@ void SpltForm::end(Outcome result, const QString& total, const QString& where) {
         Label4Total.text = wording(QStringLiteral("העבודה נעצרה. "), QStringLiteral("The work was stopped. ")) + total;
     Label4Where.text = where;
     showWhatCanBeDone();
+    tellTroubles();
     if (m_leaving && !m_chain.hasEnded())
         leave();
+}
+
+// In one box, however many files met the same fault.
+void SpltForm::tellTroubles() {
+    if (m_troubles.isEmpty())
+        return;
+    QString text = m_troubles.mid(0, troublesTold).join(QStringLiteral("\n\n"));
+    if (m_troubles.size() > troublesTold)
+        text += QStringLiteral("\n\n") + wording(QStringLiteral("ועוד %1 כאלה."), QStringLiteral("And %1 more."))
+                                             .arg(m_troubles.size() - troublesTold);
+    m_platform.dialogs.message(text);
 }
 
 Cut SpltForm::cut(const QString& path, const QString& extension) {
@@ -405,10 +424,10 @@ Cut SpltForm::cut(const QString& path, const QString& extension) {
             : wording(QStringLiteral("חלקים שנכתבו: %1 מתוך %2"), QStringLiteral("Pieces written: %1 of %2"))
                   .arg(result.pieces)
                   .arg(result.declared);
-    m_platform.dialogs.message(wording(QStringLiteral("%1 לא נחתך עד הסוף. %2; הקובץ עצמו לא השתנה."),
-                                       QStringLiteral("%1 was not cut to its end. %2; the file itself is as it was."))
-                                   .arg(LeafName(path), written) +
-                               u'\n' + reason(*result.failure));
+    m_troubles += wording(QStringLiteral("%1 לא נחתך עד הסוף. %2; הקובץ עצמו לא השתנה."),
+                          QStringLiteral("%1 was not cut to its end. %2; the file itself is as it was."))
+                      .arg(LeafName(path), written) +
+                  u'\n' + reason(*result.failure);
     return result;
 }
 
@@ -418,11 +437,11 @@ Joined SpltForm::join(int index) {
     Family& family = families.at(static_cast<std::size_t>(index));
     if (result.failure) {
         family.fate = Family::Fate::Failed;
-        m_platform.dialogs.message(
+        m_troubles +=
             wording(QStringLiteral("%1 לא צורף. החלקים לא השתנו, ולא נותר קובץ חלקי."),
                     QStringLiteral("%1 was not joined. The pieces are as they were, and no half file is left."))
                 .arg(LeafName(path)) +
-            u'\n' + reason(*result.failure));
+            u'\n' + reason(*result.failure);
     } else if (!result.stopped) {
         family.fate = result.pieces == result.declared ? Family::Fate::Joined : Family::Fate::JoinedShort;
     }

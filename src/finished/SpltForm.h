@@ -99,6 +99,7 @@ private:
     Cut cut(const QString& path, const QString& extension);
     Joined join(int index);
     QString reason(const Failure& failure) const;
+    void tellTroubles();
     void leave();
 
     SessionState& m_state;
@@ -108,6 +109,7 @@ private:
     QString m_folder; // where the last file was picked
     int m_index = 0;  // of the file or family in hand
     int m_count = 0;
+    QStringList m_troubles; // of the work in hand
     bool m_stop = false;
     bool m_leaving = false;
 };

@@ -280,16 +280,23 @@ void MoogMeretView::renderWalk() {
     const int count = m_page.List1.count();
     const int index = m_page.List1.currentIndex();
     bool failed = false;
-    for (int i = 0; i < count; ++i)
+    int sent = 0;
+    for (int i = 0; i < count; ++i) {
         failed = failed || m_page.package(i) == MoogMeret::Package::Failed;
+        sent += m_page.package(i) == MoogMeret::Package::Sent ? 1 : 0;
+    }
     m_gauge->setVisible(walking);
     const double ofPackage = std::min(m_page.Label13.text.toInt(), 3) / 3.0;
     m_gauge->show(count == 0 ? 0 : (index + ofPackage) / count, u"%1 / %2"_s.arg(index + 1).arg(count),
                   m_page.Label3.text);
-    if (m_page.Label4Sof.text.isEmpty())
-        m_end->show(1, QString::number(count), m_page.Label3.text);
+    // Where nothing is sent the ring tells how far the walk came.
+    const int done = m_page.Label4Sof.text.isEmpty() ? index + 1 : sent;
+    if (failed)
+        m_end->showSign(Gauge::Mood::Bad);
+    else if (sent > 0 && sent == count)
+        m_end->showSign(Gauge::Mood::Good);
     else
-        m_end->showSign(failed ? Gauge::Mood::Bad : Gauge::Mood::Good);
+        m_end->show(count == 0 ? 0 : double(done) / count, u"%1 / %2"_s.arg(done).arg(count), m_page.Label3.text);
     m_inHand->setVisible(walking);
     m_nameInHand->setVisible(walking);
     m_parts->setVisible(walking);
@@ -301,15 +308,18 @@ void MoogMeretView::renderWalk() {
 
     const bool sending = m_page.sending();
     m_answer->setVisible(!m_page.Label4Doar.text.isEmpty() || !m_page.Label4Sof.text.isEmpty());
-    setRole(m_answer, sending ? "card" : failed ? "alarm" : "success");
+    // Good is what the server has taken, be it the package in hand or, once the walk has ended, all of them.
+    const bool good = !failed && (walking ? sent > 0 : sent > 0 && sent == count);
+    setRole(m_answer, sending ? "card" : failed ? "alarm" : good ? "success" : "notice");
     m_answer->setStyleSheet(m_answer->styleSheet());
     m_answerSign->setPixmap(theme().icon(sending  ? u"mail"_s
                                          : failed ? u"warning"_s
-                                                  : u"check-circle"_s,
+                                         : good   ? u"check-circle"_s
+                                                  : u"info"_s,
                                          theme().px(32),
-                                         sending  ? Theme::Colour::Primary
-                                         : failed ? Theme::Colour::Danger
-                                                  : Theme::Colour::Good));
+                                         failed && !sending ? Theme::Colour::Danger
+                                         : good && !sending ? Theme::Colour::Good
+                                                            : Theme::Colour::Primary));
 
     m_packages->setVisible(m_page.List1Shown.visible);
     m_packages->setEnabled(m_page.List1Shown.enabled && !sending);

@@ -146,6 +146,17 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     choose("gone\\1_jpp_001_001.prk", &SpltForm::Command8_Click);
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(at("gone")));
+
+    machine.dialogs.messages.clear();
+    for (const char* leaf : {"7.jpp", "8.jpp", "9.jpp"})
+        write(at(leaf), "gone before it is cut");
+    choose("7.jpp", &SpltForm::Command2_Click);
+    for (const QString& path : page().List4files.items())
+        (void)machine.files.removeFile(path);
+    page().Command3_Click();
+    EXPECT_EQ(machine.dialogs.messages.size(), 1) << "one box for all of them";
+    choose("7_jpp_001_001.prk", &SpltForm::Command9_Click);
+    EXPECT_EQ(page().Label4Total.text, u"7_jpp_001_001.prk was not cut to its end. Pieces: 0."_s);
 }
 
 TEST_F(SpltFormTest, AFullDiskEndsTheWorkWithOneMessage) {
