@@ -1,5 +1,6 @@
 #include "views/Gauge.h"
 
+#include <QFontMetrics>
 #include <QPainter>
 
 #include <algorithm>
@@ -62,6 +63,10 @@ void Gauge::paintEvent(QPaintEvent*) {
     }
     QFont font = m_theme.font(Theme::Type::Display);
     font.setPixelSize(m_theme.px(52));
+    // "12 / 250" has to stay within the ring.
+    const double room = side - thick - m_theme.px(16);
+    if (const int wide = QFontMetrics(font).horizontalAdvance(m_large); wide > room)
+        font.setPixelSize(std::max(1, static_cast<int>(m_theme.px(52) * room / wide)));
     painter.setFont(font);
     painter.setPen(Theme::Colour::Ink);
     const double lift = m_small.isEmpty() ? 0 : m_theme.px(14);
