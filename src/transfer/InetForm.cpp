@@ -40,12 +40,14 @@ void InetForm::Command2_Click() {
     Q_EMIT changed();
 }
 
-bool clsDownload::download(const QString& url, const QString& path) const {
+bool clsDownload::download(const QString& url, const QString& path) {
+    m_failure = {};
     const auto target = m_platform.files.drives().toHost(path);
     if (!target)
         return false;
     (void)m_platform.internet.open();
-    (void)m_platform.internet.download(url, *target);
+    if (const auto done = m_platform.internet.download(url, *target); !done)
+        m_failure = done.failure();
     return true;
 }
 

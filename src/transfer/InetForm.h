@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Result.h"
 #include "session/Page.h"
 
 namespace lumora {
@@ -33,15 +34,19 @@ private:
 };
 
 // Fetches a URL to a file under a drive path. True unless the path names no place on this machine: the download's own
-// result is not examined.
+// result is not examined, and only kept for a page that tells a person of it.
 class clsDownload {
 public:
     explicit clsDownload(const Platform& platform)
         : m_platform(platform) {}
-    bool download(const QString& url, const QString& path) const;
+    bool download(const QString& url, const QString& path);
+
+    // Of the last call; the message is empty when it went well.
+    const Failure& lastFailure() const { return m_failure; }
 
 private:
     const Platform& m_platform;
+    Failure m_failure;
 };
 
 } // namespace lumora

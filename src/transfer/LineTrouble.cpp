@@ -28,6 +28,12 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
                 QStringLiteral("The server did not open the folder of this order. Please tell the shop."));
         return state.wording(QStringLiteral("הקשר נותק לפני שנפתחה תיקיית ההזמנה בשרת."),
                              QStringLiteral("The line was cut before the order's folder on the server was open."));
+    case LineStep::File:
+        if (failure.kind != Failure::Kind::NotFound)
+            return state.wording(
+                QStringLiteral("לא ניתן לשלוח את הקובץ %1 ממחשב זה. יש להודיע לחנות.").arg(name),
+                QStringLiteral("The file %1 can't be sent from this computer. Please tell the shop.").arg(name));
+        [[fallthrough]];
     case LineStep::Put:
         if (failure.kind == Failure::Kind::NotFound)
             return state.wording(QStringLiteral("הקובץ %1 לא נמצא במחשב.").arg(name),
@@ -42,6 +48,15 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
     case LineStep::List:
         return state.wording(QStringLiteral("הקשר נותק בזמן הבדיקה מה הגיע לשרת."),
                              QStringLiteral("The line was cut while the files on the server were being checked."));
+    case LineStep::Confirm:
+        return state.wording(QStringLiteral("השרת לא אישר שכל הקבצים הגיעו. אם זה חוזר יש להודיע לחנות."),
+                             QStringLiteral("The server did not confirm that all files have arrived. If this happens "
+                                            "again, please tell the shop."));
+    case LineStep::KeepList:
+        return state.wording(
+            QStringLiteral("רשימת הקבצים מהשרת לא נכתבה במחשב זה. יש לפנות מקום בדיסק או לתקן את ההרשאות ולנסות שוב."),
+            QStringLiteral("The server's list of files can't be written on this computer. Free some space or mend the "
+                           "rights, then try again."));
     }
     return failure.message;
 }

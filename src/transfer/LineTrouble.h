@@ -9,7 +9,9 @@ namespace lumora {
 struct SessionState;
 
 // Which step of the transfer failed.
-enum class LineStep { Open, Connect, OrderFolder, Put, List };
+// File: a file of the order can't be read or named, so that it never came to the line. Confirm: the line held, and yet
+// the server's list does not say that all has arrived. KeepList: that list could not be stored on this machine.
+enum class LineStep { Open, Connect, OrderFolder, File, Put, List, Confirm, KeepList };
 
 // What a failure of the line means for the customer, in the language of the session. subject is the file's name where a
 // file is concerned.

@@ -4,6 +4,7 @@
 #include "session/Page.h"
 #include "session/TextList.h"
 #include "session/Ticker.h"
+#include "transfer/LineTrouble.h"
 #include "transfer/ServerList.h"
 #include "transfer/UploadScript.h"
 
@@ -134,11 +135,14 @@ private:
     void HttpSendDone();
     QString FetchUrl(const QString& url);
     void finishSuccess();
+    void tellReason(LineStep step, const Failure& failure, const QString& file = {});
+    LineStep listTrouble() const;
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     UploadScript m_script;
+    Failure m_listFailure; // of the last list file that was asked for; no message when it was fetched
     Phase m_phase = Phase::Checking;
     bool m_activated = false;
     bool m_busy = false; // a check runs

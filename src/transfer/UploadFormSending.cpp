@@ -33,6 +33,7 @@ void UploadForm::HttpAttempts() {
     Command15.enabled = true;
     Image5.visible = false;
     Label1.text.clear();
+    m_listFailure = {};
     Label4Reason.visible = false;
     Label4Reason.text.clear();
     // One cell serves as the number of the list file and as the count of what is missing: behind a first attempt that
@@ -95,6 +96,7 @@ void UploadForm::HttpSendFiles(int listNumber) {
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php");
     const QStringList files = List4Hossarim.items();
     qsizetype left = files.size();
+    bool allPosted = true;
     for (int i = 0; i < files.size(); ++i) {
         const QString name = LeafName(files[i]);
         Label4File.text = m_state.wording(QStringLiteral("קובץ %1 מתוך %2: %3"), QStringLiteral("File %1 of %2: %3"))
@@ -107,9 +109,8 @@ void UploadForm::HttpSendFiles(int listNumber) {
         const QString folder = ParentFolder(files[i]);
         TxtWeb.text = m_script.MultipartPost(LeafName(folder), {files[i]}, url, folder, TxtUrl.text, {}, {});
         if (m_script.failed()) {
-            Label4Reason.text = LineTroubleText(m_state, LineStep::Put, m_script.lastFailure(), name);
-            Label4Reason.hint = m_script.lastFailure().message;
-            Label4Reason.visible = true;
+            allPosted = false;
+            tellReason(m_script.failedBeforeSending() ? LineStep::File : LineStep::Put, m_script.lastFailure(), name);
         } else {
             Label12.text = QString::number(--left);
         }
@@ -123,8 +124,35 @@ void UploadForm::HttpSendFiles(int listNumber) {
     enter(Phase::Verifying);
     if (CheckOrderOnServer(listNumber) != ServerVerdict::Listed)
         takeAllAsMissing();
+    // A file that stayed behind says more than the list that lacks it.
+    if (allPosted && !List4Hossarim.isEmpty() && !m_left)
+        tellReason(listTrouble(), m_listFailure);
     showMissingCount();
     Label9.visible = Pic4Hamten.visible = false;
+}
+
+void UploadForm::tellReason(LineStep step, const Failure& failure, const QString& file) {
+    Label4Reason.text = LineTroubleText(m_state, step, failure, file);
+    Label4Reason.hint = failure.message;
+    Label4Reason.visible = true;
+}
+
+// Why a check found files missing although each was posted.
+LineStep UploadForm::listTrouble() const {
+    if (m_listFailure.message.isEmpty())
+        return LineStep::Confirm;
+    switch (m_listFailure.kind) {
+    case Failure::Kind::Disconnected:
+    case Failure::Kind::TimedOut:
+        return LineStep::List;
+    case Failure::Kind::NotFound:
+    case Failure::Kind::AccessDenied:
+    case Failure::Kind::NoSpace:
+    case Failure::Kind::Other:
+        return LineStep::KeepList;
+    default:
+        return LineStep::Confirm;
+    }
 }
 
 void UploadForm::ShowHttpProgress() {
@@ -181,7 +209,7 @@ ServerVerdict UploadForm::CheckOrderOnServer(int listNumber) {
 }
 
 void UploadForm::HttpFetchFileListN(int listNumber) {
-    const clsDownload download(m_platform);
+    clsDownload download(m_platform);
     const Files& files = m_platform.files;
     if (!files.folderExists(WorkspacePaths::root(m_state)))
         (void)files.makeFolder(WorkspacePaths::root(m_state));
@@ -198,14 +226,18 @@ void UploadForm::HttpFetchFileListN(int listNumber) {
         return;
     // The list of an earlier check would pass for the answer of this one.
     const QString list = JoinDrivePath(m_state.transfer.OrderFolder, ListFileName(0));
-    const bool cleared = !files.fileExists(list) || files.removeFile(list);
+    const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
+    if (!cleared)
+        m_listFailure = cleared.failure();
     const QString uploads = siteAddress(QStringLiteral("/uploads/") + name + u'/');
     download.download(uploads + QStringLiteral("filelist1.txt"),
                       JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("filelist1.txt")));
     HttpPause(2);
     const QString remote = ListFileName(listNumber);
-    if (cleared && !remote.isEmpty())
+    if (cleared && !remote.isEmpty()) {
         download.download(uploads + remote, list);
+        m_listFailure = download.lastFailure();
+    }
     pump();
     HttpPause(3);
     const auto size = files.size(list);

@@ -51,7 +51,14 @@ QByteArray MultipartBody(const std::vector<UploadPart>& parts) {
     return body.append("--").append(boundary).append("--");
 }
 
-Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const QString& localFolder) const {
+Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const QString& localFolder) {
+    auto body = readParts(files, localFolder);
+    m_failure = body ? Failure{} : body.failure();
+    m_fileFault = !body;
+    return body;
+}
+
+Result<QByteArray> UploadScript::readParts(const QStringList& files, const QString& localFolder) const {
     std::vector<UploadPart> parts;
     for (const QString& file : files) {
         const QString name = leafOf(file);
@@ -68,12 +75,9 @@ Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const QString&
 QString UploadScript::MultipartPost(const QString& folderName, const QStringList& files, const QString& url,
                                     const QString& localFolder, const QString& extra, const QString& user,
                                     const QString& password) {
-    m_failure = {};
     auto body = bodyOf(files, localFolder);
-    if (!body) {
-        m_failure = body.failure();
+    if (!body)
         return {};
-    }
     PostRequest request;
     request.contentType = QByteArray("multipart/form-data; boundary=") + boundary;
     request.body = std::move(*body);
@@ -89,7 +93,6 @@ QString UploadScript::MultipartPost(const QString& folderName, const QStringList
 
 QString UploadScript::MultipartPostInet(const QString& folderName, const QStringList& files, const QString& server,
                                         const QString& url, const QString& localFolder, const QString& extra) {
-    m_failure = {};
     auto body = bodyOf(files, localFolder);
     if (body) {
         PostRequest request;
@@ -102,8 +105,6 @@ QString UploadScript::MultipartPostInet(const QString& folderName, const QString
         if (answer)
             return AnsiCodePage::decode(*answer);
         m_failure = answer.failure();
-    } else {
-        m_failure = body.failure();
     }
     return QStringLiteral("Error: ") + m_failure.message;
 }

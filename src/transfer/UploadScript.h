@@ -45,12 +45,17 @@ public:
     // Of the last call; the message is empty when it went well.
     const Failure& lastFailure() const { return m_failure; }
     bool failed() const { return !m_failure.message.isEmpty(); }
+    // It lies in a file of this machine, and nothing went over the line.
+    bool failedBeforeSending() const { return m_fileFault; }
 
 private:
-    Result<QByteArray> bodyOf(const QStringList& files, const QString& localFolder) const;
+    // Begins a call: what the last one left is forgotten.
+    Result<QByteArray> bodyOf(const QStringList& files, const QString& localFolder);
+    Result<QByteArray> readParts(const QStringList& files, const QString& localFolder) const;
 
     const Platform& m_platform;
     Failure m_failure;
+    bool m_fileFault = false;
 };
 
 } // namespace lumora

@@ -60,8 +60,12 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         std::function<void(FakeWebLab&)> set;
         bool done;
         int posted; // in all attempts
+        LineStep reason = LineStep::Confirm;
     } cases[] = {
-        {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15},
+        {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15,
+         LineStep::Put},
+        {"the line is gone each time when the list is asked for", [](FakeWebLab& l) { l.deadCalls = FakeLab::always; },
+         false, 15, LineStep::List},
         {"every file is answered and none is stored, as by a script that fails",
          [](FakeWebLab& l) {
              for (const QString& name : {UploadFormRig::log(), UploadFormRig::sheet(), UploadFormRig::first(),
@@ -101,7 +105,7 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
              l.deadCalls = 9;
              l.deadPosts = 10;
          },
-         false, 15},
+         false, 15, LineStep::List},
     };
     for (const auto& c : cases) {
         SCOPED_TRACE(c.fault);
@@ -116,6 +120,11 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         EXPECT_EQ(faulty.reports.isEmpty(), !c.done);
         EXPECT_EQ(other.localFiles().size(), 5u);
         EXPECT_EQ(faulty.posted.size(), c.posted);
+        if (c.done)
+            continue;
+        EXPECT_TRUE(page.Label4Reason.visible);
+        EXPECT_EQ(page.Label4Reason.text,
+                  LineTroubleText(other.state, c.reason, {}, other.localFiles().rbegin()->first));
     }
 }
 
@@ -161,6 +170,16 @@ TEST_F(UploadFormTest, NothingIsWrittenOutsideTheOrderAndTheKeptList) {
     rig.send();
     EXPECT_EQ(everything(), before + QStringList(u"filelist1.txt"_s));
     EXPECT_EQ(rig.localFiles().size(), 5u);
+}
+
+TEST_F(UploadFormTest, AFileThatNeverCameToTheLineIsNotLaidToTheServer) {
+    const QString quoted = u"311015GNB0003_03\".jpp"_s; // its header would end at the quote
+    rig.write(quoted, "x");
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.failed);
+    EXPECT_EQ(page.Label12.text, u"1"_s);
+    EXPECT_EQ(page.Label4Reason.text, LineTroubleText(rig.state, LineStep::File, {}, quoted));
+    EXPECT_EQ(lab.posted.size(), 5);
 }
 
 TEST_F(UploadFormTest, ARestOfAnAttemptCanBeStoppedAndContinuedToo) {

@@ -131,6 +131,18 @@ TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
 }
 
+TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
+    // Where the list should be stored lies a folder.
+    const QString inTheWay = UploadFormRig::folder() + u'\\' + UploadFormRig::list();
+    ASSERT_TRUE(rig.test.files.makeFolder(inTheWay));
+    UploadForm& page = rig.send();
+    EXPECT_TRUE(page.failed);
+    EXPECT_EQ(page.Label4Reason.text, LineTroubleText(rig.state, LineStep::KeepList, {}));
+    ASSERT_TRUE(std::filesystem::remove(*rig.test.drives.toHost(inTheWay)));
+    page.Image5_Click();
+    EXPECT_TRUE(page.done);
+}
+
 TEST_F(SendByHttp, AHebrewNameArrivesInTheCodePageAndNoNameLeadsElsewhere) {
     UploadScript script(rig.test.platform);
     const QString url = lab.site() + u"/hazmanot/getfile2.php"_s;
