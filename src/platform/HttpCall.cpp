@@ -18,8 +18,6 @@
 namespace lumora {
 namespace {
 
-constexpr Poco::UInt16 httpPort = 80;
-
 Failure failure(Failure::Kind kind, const QString& url, const QString& reason) {
     return {kind, QStringLiteral("%1: %2").arg(url, reason)};
 }
@@ -45,6 +43,12 @@ Result<Address> addressOf(const QString& url) {
     return address;
 }
 
+// A numeric host of the newer kind has colons of its own, in brackets.
+std::string withPort(const std::string& host) {
+    const std::size_t name = host.rfind(']');
+    return host.find(':', name == std::string::npos ? 0 : name) == std::string::npos ? host + ":80" : host;
+}
+
 using Request = Poco::Net::HTTPRequest;
 using Sending = std::function<void(std::ostream&)>;
 
@@ -55,9 +59,7 @@ Result<int> call(const QString& url, const char* method, const std::string& vers
     if (!to)
         return to.failure();
     try {
-        const bool withPort = to->host.find(':') != std::string::npos;
-        const Poco::Net::SocketAddress address =
-            withPort ? Poco::Net::SocketAddress(to->host) : Poco::Net::SocketAddress(to->host, httpPort);
+        const Poco::Net::SocketAddress address(withPort(to->host));
         Poco::Net::HTTPClientSession session(address);
         session.setTimeout(limits.connect, limits.silence, limits.silence);
         session.setKeepAlive(false);

@@ -11,6 +11,8 @@ namespace lumora {
 
 // An answer that is kept in memory is a few words of a script.
 constexpr qsizetype largestFetchedBody = 16 * 1024 * 1024;
+// One that becomes a file is a list or a picture of the start page; a server that never ends must not fill the disk.
+constexpr qint64 largestDownload = 64 * 1024 * 1024;
 
 // Takes the next bytes of the body; false gives the answer up.
 using BodySink = std::function<bool(const char* bytes, std::size_t count)>;

@@ -76,8 +76,8 @@ public:
     // POST to an address that goes out as that of fetch does. The answer's body whatever the status is.
     virtual Result<QByteArray> post(const QString& url, const PostRequest& request) = 0;
 
-    // GET into a file, written whole or not at all; an answer of another status than 200 to 299 is a failure and leaves
-    // no file.
+    // GET into a file, written whole or not at all; an answer of another status than 200 to 299, and one
+    // without end, is a failure and leaves no file.
     virtual Result<void> download(const QString& url, const HostPath& target) = 0;
 };
 

@@ -106,9 +106,11 @@ Result<QByteArray> PocoInternet::post(const QString& url, const PostRequest& req
 Result<void> PocoInternet::download(const QString& url, const HostPath& target) {
     return RunBlocking([&]() -> Result<void> {
         NewContent content(target, toText(target));
+        qint64 taken = 0;
         const auto status = HttpGet(url, m_limits, [&](const char* bytes, std::size_t count) {
             content.append(bytes, count);
-            return !content.failed();
+            taken += static_cast<qint64>(count);
+            return !content.failed() && taken <= largestDownload;
         });
         if (!status && !content.failed())
             return status.failure();

@@ -2,6 +2,11 @@
 #include "support/LabServers.h"
 #include "support/TcpRelay.h"
 
+#include <Poco/Exception.h>
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/SocketAddress.h>
+#include <Poco/Net/StreamSocket.h>
+
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTimer>
@@ -9,6 +14,7 @@
 #include <gtest/gtest.h>
 
 #include <fstream>
+#include <thread>
 
 namespace lumora {
 namespace {
@@ -74,6 +80,27 @@ TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatWasCutOrStoodStill) {
     const auto stalled = internet.fetch(url);
     ASSERT_FALSE(stalled);
     EXPECT_EQ(stalled.failure().kind, Failure::Kind::TimedOut) << stalled.failure().message.toStdString();
+    EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
+}
+
+TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatNeverEnds) {
+    Poco::Net::ServerSocket server(Poco::Net::SocketAddress("127.0.0.1", 0));
+    std::thread endless([&] {
+        Poco::Net::StreamSocket line = server.acceptConnection();
+        std::vector<char> block(1024 * 1024, 'x');
+        line.receiveBytes(block.data(), static_cast<int>(block.size()));
+        const std::string head = "HTTP/1.1 200 OK\r\n\r\n";
+        line.sendBytes(head.data(), static_cast<int>(head.size()));
+        try {
+            for (;;)
+                line.sendBytes(block.data(), static_cast<int>(block.size()));
+        } catch (const Poco::Exception&) { // the other side has had enough
+        }
+    });
+    const auto answer = internet.download(u"http://127.0.0.1:%1/x"_s.arg(server.address().port()), target);
+    endless.join();
+    ASSERT_FALSE(answer);
+    EXPECT_EQ(answer.failure().kind, Failure::Kind::TooLarge) << answer.failure().message.toStdString();
     EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
 }
 
