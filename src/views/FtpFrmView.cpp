@@ -62,11 +62,13 @@ QWidget* FtpFrmView::makeProgress() {
     line(u"Label3"_s, m_page.Label3, "title");
     line(u"Label4File"_s, m_page.Label4File, "muted");
     line(u"Label34"_s, m_page.Label34, "strong");
-    auto* minutes = new QHBoxLayout;
+    m_minutes = new QWidget(box);
+    auto* minutes = new QHBoxLayout(m_minutes);
+    minutes->setContentsMargins(0, 0, 0, 0);
     minutes->addStretch(1);
-    m_minutesTitle = label(u"Label4DiffTitle"_s, m_page.Label4DiffTitle, "muted");
-    m_minutesTitle->setWordWrap(false);
-    minutes->addWidget(m_minutesTitle);
+    QLabel* title = label(u"Label4DiffTitle"_s, m_page.Label4DiffTitle, "muted");
+    title->setWordWrap(false);
+    minutes->addWidget(title);
     minutes->addWidget(label(u"Label4Diff"_s, m_page.Label4Diff, "strong"));
     m_minutesUnit = makeLabel(box, "muted");
     m_minutesUnit->setWordWrap(false);
@@ -79,7 +81,7 @@ QWidget* FtpFrmView::makeProgress() {
     bind(u"PicInProgKatan"_s, m_pieces,
          [this] { return u"%1 %"_s.arg(m_page.PicInProgKatanWidth * 100 / FtpBoard::Pic4ProgWidth); });
     column->addWidget(m_pieces, 0, Qt::AlignHCenter);
-    column->addLayout(minutes);
+    column->addWidget(m_minutes);
     line(u"Label4Do"_s, m_page.Label4Do, "body");
     column->addStretch(1);
 
@@ -316,9 +318,7 @@ void FtpFrmView::render() {
     m_pieces->setVisible(inPieces);
     m_pieces->setValue(m_page.PicInProgKatanWidth);
     m_pieces->setAccessibleName(wording(u"חלקי ההזמנה"_s, u"Pieces of the order"_s));
-    const bool minutesKnown = m_page.Label4DiffTitle.visible && !m_page.Label4Diff.text.isEmpty();
-    m_minutesTitle->setVisible(minutesKnown);
-    m_minutesUnit->setVisible(minutesKnown);
+    m_minutes->setVisible(inPieces && !m_page.Label4Diff.text.isEmpty());
     m_minutesUnit->setText(wording(u"דקות"_s, u"minutes"_s));
 
     m_failure->setVisible(failed && (m_page.Picture6.visible || m_page.Label4Reason.visible));

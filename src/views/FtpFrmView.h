@@ -33,7 +33,7 @@ private:
     const Files& m_files;
     Gauge* m_gauge = nullptr;
     QProgressBar* m_pieces = nullptr;
-    QLabel* m_minutesTitle = nullptr;
+    QWidget* m_minutes = nullptr;
     QLabel* m_minutesUnit = nullptr;
     QFrame* m_failure = nullptr;
     QLabel* m_failureLine = nullptr;
