@@ -138,6 +138,7 @@ void UploadForm::showWhatToDo() {
 void UploadForm::enter(Phase phase) {
     m_phase = phase;
     sending = phase == Phase::Sending || phase == Phase::Verifying || phase == Phase::Reporting;
+    verifying = phase == Phase::Verifying;
     done = phase == Phase::Success || phase == Phase::AllThere;
     failed = phase == Phase::NotAll || phase == Phase::NoOrder || phase == Phase::NoServer;
     Command10.visible = phase == Phase::Stopped;

@@ -92,8 +92,9 @@ public:
     Ticker Timer1;         // 1 ms
     Ticker Timer2;         // 1000 ms
     bool sending = false;
-    bool done = false;   // all has arrived
-    bool failed = false; // three attempts were not enough, or nothing can be sent
+    bool verifying = false; // every file has gone, and the server is asked which have arrived
+    bool done = false;      // all has arrived
+    bool failed = false;    // three attempts were not enough, or nothing can be sent
 
     // The signal is Page::changed().
 

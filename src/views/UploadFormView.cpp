@@ -169,8 +169,8 @@ void UploadFormView::render() {
     else if (counting)
         m_gauge->show(Val(m_page.Label8.text) / countdownFrom, m_page.Label8.text.trimmed(),
                       m_page.Label14.text.trimmed());
-    else if (checking)
-        m_gauge->show(0, u"…"_s, wording(u"בודקים"_s, u"checking"_s));
+    else if (checking || m_page.verifying) // the share of the last file that began says nothing any more
+        m_gauge->show(m_page.verifying ? 1 : 0, u"…"_s, wording(u"בודקים"_s, u"checking"_s));
     else
         m_gauge->show(m_page.percent / 100.0, u"%1%"_s.arg(m_page.percent), wording(u"נשלחו"_s, u"sent"_s));
     m_gauge->setAccessibleName(m_page.Label4Do.text);
