@@ -40,11 +40,11 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
                                  QStringLiteral("The file %1 was not found on this computer.").arg(name));
         if (answered)
             return state.wording(
-                QStringLiteral("השרת לא קיבל את הקובץ %1. הוא יישלח שוב.").arg(name),
-                QStringLiteral("The server did not accept the file %1. It will be sent again.").arg(name));
+                QStringLiteral("השרת לא קיבל את הקובץ %1. הוא עדיין לא הגיע.").arg(name),
+                QStringLiteral("The server did not accept the file %1. It has not arrived yet.").arg(name));
         return state.wording(
-            QStringLiteral("הקשר נותק בזמן שליחת הקובץ %1. הוא יישלח שוב.").arg(name),
-            QStringLiteral("The line was cut while %1 was being sent. It will be sent again.").arg(name));
+            QStringLiteral("הקשר נותק בזמן שליחת הקובץ %1. הוא עדיין לא הגיע.").arg(name),
+            QStringLiteral("The line was cut while %1 was being sent. It has not arrived yet.").arg(name));
     case LineStep::List:
         return state.wording(QStringLiteral("הקשר נותק בזמן הבדיקה מה הגיע לשרת."),
                              QStringLiteral("The line was cut while the files on the server were being checked."));

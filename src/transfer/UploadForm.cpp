@@ -36,7 +36,7 @@ UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain&
     TxtUrl.text = QStringLiteral("value1=Hello&value2=World!");
     Command15.enabled = false;
     for (Caption* control : {&Picture1, &Picture5, &Picture6, &Pic4Timer, &Pic4Hamten, &Image5, &Command3, &Command10,
-                             &Label9, &Label11, &Label4Reason})
+                             &Command28, &Label9, &Label11, &Label4Reason})
         control->visible = false;
     // The page acts once it is in front, so that what it does is seen; made alone it sends nothing.
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
@@ -72,6 +72,7 @@ void UploadForm::setTexts() {
     set(Command2, QStringLiteral("רענן רשימה"), QStringLiteral("Refresh list"));
     set(Command3, QStringLiteral("עצור את המשלוח"), QStringLiteral("Stop the sending"));
     set(Command10, QStringLiteral("המשך את המשלוח"), QStringLiteral("Continue the sending"));
+    set(Command28, QStringLiteral("הזמנה חדשה"), QStringLiteral("New order"));
     set(Image3, QStringLiteral("סגור"), QStringLiteral("Close"));
     set(Image5, QStringLiteral("שלח שוב"), QStringLiteral("Send again"));
     set(Label9, QStringLiteral("שולח"), QStringLiteral("Sending"));
@@ -125,8 +126,8 @@ void UploadForm::showWhatToDo() {
         break;
     case Phase::Success:
     case Phase::AllThere:
-        say(QStringLiteral("כל ההזמנה הגיעה. אפשר לסגור."),
-            QStringLiteral("The whole order has arrived. You can close the program."));
+        say(QStringLiteral("כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה."),
+            QStringLiteral("The whole order has arrived. You can close the program or begin a new order."));
         break;
     case Phase::NotAll:
         say(QStringLiteral("ההזמנה שמורה במחשב זה. יש להמתין מעט וללחוץ על הלחצן שלח שוב."),
@@ -142,6 +143,7 @@ void UploadForm::enter(Phase phase) {
     done = phase == Phase::Success || phase == Phase::AllThere;
     failed = phase == Phase::NotAll || phase == Phase::NoOrder || phase == Phase::NoServer;
     Command10.visible = phase == Phase::Stopped;
+    Command28.visible = done || failed || phase == Phase::Stopped;
     Command3.visible = phase == Phase::Countdown || phase == Phase::Verifying || phase == Phase::NotAll;
     showWhatToDo();
     Q_EMIT changed();
@@ -293,6 +295,14 @@ void UploadForm::Command10_Click() {
 void UploadForm::Image5_Click() {
     if (idle() && m_phase == Phase::NotAll)
         HttpAttempts();
+}
+
+// An order that has not gone stays in its folder and is found among the finished ones.
+void UploadForm::Command28_Click() {
+    if (!idle())
+        return;
+    m_chain.show(PageId::hatchala);
+    m_chain.unload(PageId::UploadForm);
 }
 
 void UploadForm::Image3_Click() {

@@ -32,6 +32,7 @@ public:
     void Command4_Click();  // what is missing on the server
     void Command3_Click();  // stop the sending
     void Command10_Click(); // continue the sending
+    void Command28_Click(); // a new order
     void Image5_Click();    // up to three attempts, anew
     void Image3_Click();    // close
 
@@ -69,6 +70,7 @@ public:
     Caption Command2;      // refresh
     Caption Command3;      // stop
     Caption Command10;     // continue
+    Caption Command28;     // a new order; shown in the end states
     Caption Command15;     // as the design has it: enabled while files travel, and without a handler
     Caption Label1;        // which attempt
     Caption Label4;        // index of the file that travels

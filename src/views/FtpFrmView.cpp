@@ -364,8 +364,7 @@ void FtpFrmView::render() {
     // One main action at a time; the others that the page allows stand beside it or wait.
     m_sendNow->setVisible(m_page.Image5.visible && !failed && !done && !m_page.sending);
     m_sendAgain->setVisible(m_page.Command10.visible && failed);
-    setRole(m_newOrder, done || nothing ? "main" : "secondary");
-    m_newOrder->setStyleSheet(m_newOrder->styleSheet());
+    changeRole(m_newOrder, done || nothing ? "main" : "secondary");
     m_newOrder->setVisible(m_page.Command28.visible);
     m_stop->setVisible(m_page.Command15.visible && m_page.sending);
     m_count->setVisible(m_page.Command23.visible && !m_page.sending && !failed && !done && !nothing);

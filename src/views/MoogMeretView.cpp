@@ -310,8 +310,7 @@ void MoogMeretView::renderWalk() {
     m_answer->setVisible(!m_page.Label4Doar.text.isEmpty() || !m_page.Label4Sof.text.isEmpty());
     // Good is what the server has taken, be it the package in hand or, once the walk has ended, all of them.
     const bool good = !failed && (walking ? sent > 0 : sent > 0 && sent == count);
-    setRole(m_answer, sending ? "card" : failed ? "alarm" : good ? "success" : "notice");
-    m_answer->setStyleSheet(m_answer->styleSheet());
+    changeRole(m_answer, sending ? "card" : failed ? "alarm" : good ? "success" : "notice");
     m_answerSign->setPixmap(theme().icon(sending  ? u"mail"_s
                                          : failed ? u"warning"_s
                                          : good   ? u"check-circle"_s

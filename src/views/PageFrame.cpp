@@ -19,6 +19,13 @@ void setRole(QWidget* widget, const char* role) {
     widget->setProperty("role", QString::fromLatin1(role));
 }
 
+void changeRole(QWidget* widget, const char* role) {
+    if (widget->property("role").toString() == QLatin1StringView(role))
+        return;
+    setRole(widget, role);
+    widget->setStyleSheet(widget->styleSheet());
+}
+
 PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     : QWidget(parent)
     , m_theme(theme) {

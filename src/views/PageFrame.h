@@ -54,5 +54,7 @@ private:
 // Labels take their look from the theme by this.
 QLabel* makeLabel(QWidget* parent, const char* type);
 void setRole(QWidget* widget, const char* role);
+// The same for a widget that may have been shown, which takes its new look at once.
+void changeRole(QWidget* widget, const char* role);
 
 } // namespace lumora

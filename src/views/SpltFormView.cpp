@@ -247,10 +247,7 @@ void SpltFormView::renderResult() {
                        : m_page.outcome == Outcome::Good   ? "success"
                        : m_page.outcome == Outcome::Partly ? "notice"
                                                            : "alarm";
-    if (m_result->property("role").toString() != QLatin1StringView(role)) {
-        setRole(m_result, role);
-        m_result->setStyleSheet(m_result->styleSheet());
-    }
+    changeRole(m_result, role);
     const bool good = m_page.outcome == Outcome::Good;
     m_resultSign->setPixmap(theme().icon(m_page.busy || !told ? u"info"_s
                                          : good               ? u"check-circle"_s

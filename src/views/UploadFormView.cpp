@@ -122,8 +122,10 @@ void UploadFormView::makeBars() {
     frame().addSecondaryAction(m_stop);
     m_goOn = button(u"Command10"_s, m_page.Command10, Role::Main, [this] { m_page.Command10_Click(); });
     m_again = button(u"Image5"_s, m_page.Image5, Role::Main, [this] { m_page.Image5_Click(); });
-    m_close = button(u"endClose"_s, m_page.Image3, Role::Main, [this] { m_page.Image3_Click(); });
-    for (QPushButton* main : {m_goOn, m_again, m_close})
+    m_close = button(u"endClose"_s, m_page.Image3, Role::Secondary, [this] { m_page.Image3_Click(); });
+    m_newOrder = button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); });
+    frame().addSecondaryAction(m_close);
+    for (QPushButton* main : {m_newOrder, m_goOn, m_again})
         frame().addMainAction(main);
 }
 
@@ -201,13 +203,16 @@ void UploadFormView::render() {
     m_endPhone->setVisible(!phone.isEmpty());
     m_stop->setVisible(counting);
     m_refresh->setVisible(!m_page.sending && (waiting || m_page.failed));
-    m_close->setVisible(m_page.done || (m_page.failed && !m_page.Image5.visible));
+    const bool ended = m_page.done || (m_page.failed && !m_page.Image5.visible);
+    m_close->setVisible(ended);
+    m_newOrder->setVisible(m_page.Command28.visible);
+    changeRole(m_newOrder, ended ? "main" : "secondary");
     // While files travel nothing is chosen; afterwards the main action is.
-    QWidget* main = m_page.Image5.visible        ? static_cast<QWidget*>(m_again)
-                    : waiting                    ? m_goOn
-                    : counting                   ? m_stop
-                    : m_close->isVisibleTo(this) ? m_close
-                                                 : static_cast<QWidget*>(this);
+    QWidget* main = m_page.Image5.visible ? static_cast<QWidget*>(m_again)
+                    : waiting             ? m_goOn
+                    : counting            ? m_stop
+                    : ended               ? m_newOrder
+                                          : static_cast<QWidget*>(this);
     if (std::exchange(m_main, main) != main)
         main->setFocus(Qt::OtherFocusReason);
 }

@@ -43,6 +43,7 @@ private:
     QPushButton* m_again = nullptr;
     QPushButton* m_goOn = nullptr;
     QPushButton* m_refresh = nullptr;
+    QPushButton* m_newOrder = nullptr;
     QPushButton* m_close = nullptr; // in the end
     QWidget* m_main = nullptr;      // the main action that was in sight last
 };

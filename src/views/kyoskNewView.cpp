@@ -508,8 +508,7 @@ void kyoskNewView::renderClosing() {
     m_domain->display(m_page.Combo1Items, m_page.Combo1Index, m_page.Combo1.text);
     m_at->setVisible(m_page.Text1.visible);
     const bool local = !m_page.Command8.visible && m_page.Command7.visible;
-    setRole(m_withoutAddress, local ? "main" : "secondary");
-    m_withoutAddress->setStyleSheet(m_withoutAddress->styleSheet());
+    changeRole(m_withoutAddress, local ? "main" : "secondary");
     m_closing->setFirstFocus(m_page.Text1.visible ? m_mail : m_page.Txt4Ml2.visible ? m_albumMail : m_note);
     m_closing->setOpen(m_page.Frame4.visible);
 }

@@ -95,6 +95,8 @@ TEST_P(UploadFormLook, FromTheCheckThroughAFailureToTheEndPanel) {
     waitUntil([&] { return page().done; });
     EXPECT_TRUE(page().Label11.visible);
     look(walk, u"70-http-all-there"_s);
+    walk.press(u"UploadForm"_s, u"Command28"_s);
+    EXPECT_EQ(chain.front()->id(), PageId::hatchala);
 }
 
 TEST_P(UploadFormLook, WithoutAServerAndWithoutAnOrder) {
