@@ -38,7 +38,7 @@ Result<Descriptor> openSource(const std::filesystem::path& host, const QString& 
 // The next bytes of an open file, up to the capacity given; 0 at the end.
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
 
-// Passes over the first bytes of an open file.
+// The next bytes that are read are those behind the first offset ones.
 Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path);
 
 // The whole file; one larger than that many bytes is a failure. path is for the message.
@@ -69,9 +69,9 @@ private:
     int m_error = 0;
 };
 
+inline constexpr qint64 toTheEnd = std::numeric_limits<qint64>::max();
 // Appends the next bytes of the source, up to count of them, and tells how many there were. Stops early when the target
 // has failed, which its commit tells.
-inline constexpr qint64 toTheEnd = std::numeric_limits<qint64>::max();
 Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path);
 
 // All of it at once.

@@ -51,12 +51,12 @@ public:
     // Leaf names of the sub-folders, sorted in the same way.
     QStringList folders(const QString& folder) const;
 
-    // folder + "\" + name for each file; through the sub-folders too when recurse is set. unreadable takes a line for
-    // each folder that may not be read, else those are passed over.
+    // folder + "\" + name for each file. unreadable takes a line for each folder that may not be read; without it those
+    // are passed over.
     enum class Depth { ThisFolder, WithSubfolders };
     QStringList collect(const QString& folder, Depth depth, QStringList* unreadable = nullptr) const;
 
-    // For who reads or writes a file in parts.
+    // The place on this machine, for who reads or writes a file in parts.
     Result<HostPath> host(const QString& path) const;
 
 private:

@@ -1,21 +1,15 @@
 #pragma once
 
 #include "platform/Internet.h"
+#include "platform/TimeLimits.h"
 
 #include <Poco/Net/ServerSocket.h>
 #include <Poco/Net/StreamSocket.h>
-#include <Poco/Timespan.h>
 
 #include <functional>
 #include <string>
 
 namespace lumora {
-
-// How long the line may be silent.
-struct TimeLimits {
-    Poco::Timespan connect = Poco::Timespan(30, 0);
-    Poco::Timespan silence = Poco::Timespan(60, 0); // no byte and no reply
-};
 
 // The dialogue of one FTP connection. It is written on sockets and not on the library's FTP session because the reply
 // that closes a transfer decides here, a failed write must be seen, and the server's own words go into every failure.

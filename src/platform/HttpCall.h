@@ -1,7 +1,8 @@
 #pragma once
 
 #include "common/Result.h"
-#include "platform/FtpSessionWire.h"
+#include "platform/Internet.h"
+#include "platform/TimeLimits.h"
 
 #include <QString>
 

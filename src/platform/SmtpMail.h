@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/FtpSessionWire.h"
 #include "platform/Mail.h"
+#include "platform/TimeLimits.h"
 
 namespace lumora {
 
