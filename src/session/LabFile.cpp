@@ -9,6 +9,7 @@
 #include <QStringDecoder>
 
 #include <functional>
+#include <map>
 
 // Read with Qt's own file class: the drives, which the rest of the program reads through, are what this file decides.
 
@@ -267,11 +268,14 @@ std::vector<Key> mailKeys() {
          text(&MailAccount::password, ".{0,80}")},
         {mail, QStringLiteral("Tls"), QStringLiteral("none, starttls or tls"),
          [](D& d, const QString& value) {
-             const QStringList words = {QStringLiteral("none"), QStringLiteral("starttls"), QStringLiteral("tls")};
-             const qsizetype at = words.indexOf(value.toLower());
-             if (at < 0)
+             static const std::map<QString, MailEncryption> words = {
+                 {QStringLiteral("none"), MailEncryption::None},
+                 {QStringLiteral("starttls"), MailEncryption::StartTls},
+                 {QStringLiteral("tls"), MailEncryption::Tls}};
+             const auto word = words.find(value.toLower());
+             if (word == words.end())
                  return false;
-             d.profile.mail.encryption = static_cast<MailEncryption>(at);
+             d.profile.mail.encryption = word->second;
              return true;
          }},
         {mail, QStringLiteral("From"), address, text(&MailAccount::from, bareAddress)},
