@@ -42,9 +42,11 @@ void InetForm::Command2_Click() {
 
 bool clsDownload::download(const QString& url, const QString& path) {
     m_failure = {};
-    const auto target = m_platform.files.drives().toHost(path);
-    if (!target)
+    const auto target = m_platform.files.host(path);
+    if (!target) {
+        m_failure = target.failure();
         return false;
+    }
     (void)m_platform.internet.open();
     if (const auto done = m_platform.internet.download(url, *target); !done)
         m_failure = done.failure();
