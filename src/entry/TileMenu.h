@@ -21,7 +21,7 @@ enum TileIndex {
     TileCount
 };
 
-// Which tiles a client sees, by its letter; a letter that is not known has the tiles of the design. Then the switches:
+// Which tiles a client sees, by its letter; a letter that is not known has all the ordinary tiles. Then the switches:
 // TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away.
 std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar);
 

@@ -64,7 +64,7 @@ struct FtpBoard {
     // The panel "not all arrived": five lines, two of them numbers.
     Caption Picture6 = hidden();
     Caption Label4Nichshal;    // "the computer failed to upload "
-    Caption Label31;           // as the design has it: the count of a list that nothing fills
+    Caption Label31;           // the count of a list that nothing fills
     Caption Label4Missing;     // the true number of missing files
     Caption Label4Mitoch;      // "files out of "
     Caption Label12;           // files meant for sending

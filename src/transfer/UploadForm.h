@@ -71,7 +71,7 @@ public:
     Caption Command3;      // stop
     Caption Command10;     // continue
     Caption Command28;     // a new order; shown in the end states
-    Caption Command15;     // as the design has it: enabled while files travel, and without a handler
+    Caption Command15;     // enabled while files travel, and without a handler
     Caption Label1;        // which attempt
     Caption Label4;        // index of the file that travels
     Caption Label7;        // percent
