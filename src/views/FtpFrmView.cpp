@@ -34,11 +34,9 @@ FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& the
     , m_page(page)
     , m_files(files) {
     frame().steps().setStep(OrderStep::Sending);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.px(28));
-    row->addWidget(makeProgress(), 3);
-    row->addWidget(makeSide(), 2);
-    frame().content()->addLayout(row, 1);
+    QWidget* progress = makeProgress(); // the keyboard goes the way the controls are made
+    QWidget* side = makeSide();
+    frame().content()->addLayout(layOutSending(theme, progress, side), 1);
     makeBars();
     makePanels();
     bindTheRest();
@@ -46,13 +44,10 @@ FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& the
 }
 
 QWidget* FtpFrmView::makeProgress() {
-    auto* box = new QWidget(this);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(10));
-    column->addStretch(1);
-    m_gauge = new Gauge(theme(), box);
-    column->addWidget(m_gauge, 6, Qt::AlignCenter);
+    const ProgressColumn progress = makeProgressColumn(theme(), this);
+    QWidget* box = progress.box;
+    QVBoxLayout* column = progress.column;
+    m_gauge = progress.gauge;
     const auto line = [&](const QString& name, const Caption& caption, const char* type) {
         auto* made = label(name, caption, type);
         made->setAlignment(Qt::AlignCenter);
@@ -98,16 +93,8 @@ QWidget* FtpFrmView::makeProgress() {
 }
 
 QWidget* FtpFrmView::makeSide() {
-    auto* box = new QWidget(this);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(14));
-    const auto card = [&](const char* role) {
-        const SendingCard made = makeSendingCard(theme(), box, role);
-        column->addWidget(made.frame);
-        return made;
-    };
-    const auto [order, orderLines] = card("card");
+    const CardColumn cards = makeCardColumn(theme(), this);
+    const auto [order, orderLines] = cards.add("card");
     m_order = order;
     m_orderHead = makeLabel(order, "smallMuted");
     orderLines->addWidget(m_orderHead);
@@ -120,12 +107,12 @@ QWidget* FtpFrmView::makeSide() {
                               u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s),
                           0, Qt::AlignLeading);
 
-    const auto [delivery, deliveryLines] = card("notice");
+    const auto [delivery, deliveryLines] = cards.add("notice");
     m_delivery = delivery;
     deliveryLines->addWidget(label(u"Label15"_s, m_page.Label15, "strong"));
     deliveryLines->addWidget(label(u"Label4Ktovet"_s, m_page.Label4Ktovet));
 
-    const auto [summary, summaryColumn] = card("card");
+    const auto [summary, summaryLines] = cards.add("card");
     m_summary = summary;
     auto* head = new QHBoxLayout;
     auto* sign = new QLabel(summary);
@@ -133,24 +120,24 @@ QWidget* FtpFrmView::makeSide() {
     head->addWidget(sign);
     m_successLine = makeLabel(summary, "large");
     head->addWidget(m_successLine, 1);
-    summaryColumn->addLayout(head);
+    summaryLines->addLayout(head);
     m_summaryLines = makeLabel(summary, "body");
     bind(u"Picture2"_s, m_summaryLines, [this] { return m_page.Picture2Lines.join(u'\n'); });
-    summaryColumn->addWidget(m_summaryLines);
+    summaryLines->addWidget(m_summaryLines);
 
-    m_proof = new PictureBox(theme(), box);
+    m_proof = new PictureBox(theme(), cards.box);
     m_proof->setMinimumHeight(theme().px(120));
     bind(u"Picture13"_s, m_proof, m_page.Picture13);
-    column->addWidget(m_proof, 1);
-    column->addStretch(1);
+    cards.column->addWidget(m_proof, 1);
+    cards.column->addStretch(1);
     auto* fault = button(
         u"Command22"_s, m_page.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
-    column->addWidget(fault, 0, Qt::AlignLeading);
-    column->addWidget(
+    cards.column->addWidget(fault, 0, Qt::AlignLeading);
+    cards.column->addWidget(
         button(
             u"Command24"_s, m_page.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s),
         0, Qt::AlignLeading);
-    return box;
+    return cards.box;
 }
 
 void FtpFrmView::makeBars() {

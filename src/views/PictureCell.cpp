@@ -151,9 +151,7 @@ void PictureCell::paintEvent(QPaintEvent*) {
         const QRectF line(theme().px(8), m_strip->y(), width() - theme().px(16), m_strip->height());
         painter.drawText(
             line, Qt::AlignCenter,
-            QChar(0x2066) +
-                painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle, static_cast<int>(line.width())) +
-                QChar(0x2069));
+            fromLeft(painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle, static_cast<int>(line.width()))));
     }
 }
 

@@ -315,8 +315,7 @@ void PicturePicker::open(const HostPath& folder) {
     }
     if (best < m_places.size())
         m_placeButtons[best]->setChecked(true);
-    m_where->setText(QChar(0x2066) + m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480)) +
-                     QChar(0x2069));
+    m_where->setText(fromLeft(m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480))));
     m_where->setToolTip(toText(folder));
 
     std::vector<HostPath> folders;

@@ -38,8 +38,6 @@ void ScrolledPicture::setScroll(QPoint value, QPoint max) {
         bar.setRange(0, last);
         bar.setValue(to);
     };
-    setHorizontalScrollBarPolicy(max.x() > 0 ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
-    setVerticalScrollBarPolicy(max.y() > 0 ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
     set(*horizontalScrollBar(), value.x(), max.x());
     set(*verticalScrollBar(), value.y(), max.y());
     // A bar that can't be moved says nothing.

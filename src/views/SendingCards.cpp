@@ -1,5 +1,6 @@
 #include "views/SendingCards.h"
 
+#include "views/Gauge.h"
 #include "views/PageFrame.h"
 
 #include <QFrame>
@@ -35,10 +36,41 @@ SendingCard makeSignedCard(const Theme& theme, QWidget* parent, const char* role
     return {frame, column};
 }
 
+QHBoxLayout* layOutSending(const Theme& theme, QWidget* progress, QWidget* side) {
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme.px(28));
+    row->addWidget(progress, 3);
+    row->addWidget(side, 2);
+    return row;
+}
+
+ProgressColumn makeProgressColumn(const Theme& theme, QWidget* parent) {
+    auto* box = new QWidget(parent);
+    auto* column = new QVBoxLayout(box);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme.px(10));
+    column->addStretch(1);
+    auto* gauge = new Gauge(theme, box);
+    column->addWidget(gauge, 6, Qt::AlignCenter);
+    return {box, column, gauge};
+}
+
+SendingCard CardColumn::add(const char* role) const {
+    const SendingCard made = makeSendingCard(theme, box, role);
+    column->addWidget(made.frame);
+    return made;
+}
+
+CardColumn makeCardColumn(const Theme& theme, QWidget* parent) {
+    auto* box = new QWidget(parent);
+    auto* column = new QVBoxLayout(box);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(theme.px(14));
+    return {theme, box, column};
+}
+
 QString orderNameLine(const QString& name, bool english) {
-    // The first mark of direction decides at which side a label begins.
-    return QChar(english ? 0x200E : 0x200F) + (QChar(0x2066) + QString(name).replace(u'_', u"_\u200B"_s)) +
-           QChar(0x2069);
+    return atLineStart(fromLeft(QString(name).replace(u'_', u"_\u200B"_s)), english);
 }
 
 } // namespace lumora

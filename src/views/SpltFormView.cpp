@@ -15,15 +15,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-// Names and paths run from left to right in a Hebrew line too.
-QString fromLeft(const QString& text) {
-    return QChar(0x2066) + text + QChar(0x2069);
-}
-
-} // namespace
-
 SpltFormView::SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
     , m_page(page) {
@@ -262,8 +253,7 @@ void SpltFormView::renderResult() {
                              : wording(u"בחרו תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים."_s,
                                        u"Choose a folder to cut, or a folder of pieces to join. "
                                        "The files themselves never change."_s)));
-    // The mark in front gives the line the side of the page.
-    m_resultWhere->setText(QChar(state().english() ? 0x200E : 0x200F) + fromLeft(m_page.Label4Where.text));
+    m_resultWhere->setText(atLineStart(fromLeft(m_page.Label4Where.text), state().english()));
     m_resultWhere->setVisible(!m_page.busy && !m_page.Label4Where.text.isEmpty());
     m_progress->setVisible(m_page.busy);
     m_progress->setValue(m_page.percent);

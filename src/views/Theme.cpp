@@ -241,6 +241,15 @@ void Theme::apply(QApplication& application) {
     QApplication::setPalette(palette);
 }
 
+QString fromLeft(const QString& text) {
+    return QChar(0x2066) + text + QChar(0x2069);
+}
+
+QString atLineStart(const QString& text, bool english) {
+    // The first mark of direction decides at which side a label begins.
+    return QChar(english ? 0x200E : 0x200F) + text;
+}
+
 QString isolated(const QString& text) {
     // Paths, addresses of the web and of mail, names of files, sizes, "3 / 12", percentages, telephone numbers.
     static const QRegularExpression ownDirection(

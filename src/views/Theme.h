@@ -81,5 +81,9 @@ private:
 // A line of text with the places that must keep their own direction (sizes, paths, addresses, "3 / 12") set apart, so
 // that a sentence in Hebrew does not turn them over.
 QString isolated(const QString& text);
+// Names and paths run from left to right in a Hebrew line too.
+QString fromLeft(const QString& text);
+// A line that begins with a text of its own direction, and still stands at the side of its page.
+QString atLineStart(const QString& text, bool english);
 
 } // namespace lumora

@@ -26,24 +26,19 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
     : PageView(page, state, theme)
     , m_page(page) {
     frame().steps().setStep(OrderStep::Sending);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.px(28));
-    row->addWidget(makeProgress(), 3);
-    row->addWidget(makeSide(), 2);
-    frame().content()->addLayout(row, 1);
+    QWidget* progress = makeProgress(); // the keyboard goes the way the controls are made
+    QWidget* side = makeSide();
+    frame().content()->addLayout(layOutSending(theme, progress, side), 1);
     makeBars();
     bindTheRest();
     start();
 }
 
 QWidget* UploadFormView::makeProgress() {
-    auto* box = new QWidget(this);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(10));
-    column->addStretch(1);
-    m_gauge = new Gauge(theme(), box);
-    column->addWidget(m_gauge, 6, Qt::AlignCenter);
+    const ProgressColumn progress = makeProgressColumn(theme(), this);
+    QWidget* box = progress.box;
+    QVBoxLayout* column = progress.column;
+    m_gauge = progress.gauge;
     const auto line = [&](QLabel* made) {
         made->setAlignment(Qt::AlignCenter);
         column->addWidget(made);
@@ -74,16 +69,8 @@ QWidget* UploadFormView::makeProgress() {
 }
 
 QWidget* UploadFormView::makeSide() {
-    auto* box = new QWidget(this);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(14));
-    const auto card = [&](const char* role) {
-        const SendingCard made = makeSendingCard(theme(), box, role);
-        column->addWidget(made.frame);
-        return made;
-    };
-    const auto [order, orderLines] = card("card");
+    const CardColumn cards = makeCardColumn(theme(), this);
+    const auto [order, orderLines] = cards.add("card");
     m_order = order;
     m_orderHead = makeLabel(order, "smallMuted");
     orderLines->addWidget(m_orderHead);
@@ -97,7 +84,7 @@ QWidget* UploadFormView::makeSide() {
     bind(u"Label10"_s, m_phone, [this] { return m_page.Label10.text; });
     orderLines->addWidget(m_phone);
 
-    const auto [end, endLines] = card("notice");
+    const auto [end, endLines] = cards.add("notice");
     m_end = end;
     endLines->addWidget(label(u"Label4Alu"_s, m_page.Label4Alu, "large"));
     endLines->addWidget(label(u"Label4Rshom"_s, m_page.Label4Rshom, "body"));
@@ -107,11 +94,11 @@ QWidget* UploadFormView::makeSide() {
     endLines->addWidget(label(u"Label4Tashlum"_s, m_page.Label4Tashlum, "body"));
     m_endPhone = makeLabel(end, "large");
     endLines->addWidget(m_endPhone);
-    column->addStretch(1);
+    cards.column->addStretch(1);
     m_refresh = button(
         u"Command2"_s, m_page.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }, u"resend"_s);
-    column->addWidget(m_refresh, 0, Qt::AlignLeading);
-    return box;
+    cards.column->addWidget(m_refresh, 0, Qt::AlignLeading);
+    return cards.box;
 }
 
 void UploadFormView::makeBars() {

@@ -535,8 +535,7 @@ void kyoskNewView::render() {
     const QString folder = m_page.Label29.text.trimmed();
     QString line;
     if (!folder.isEmpty())
-        line = QChar(0x2066) + m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200)) +
-               QChar(0x2069);
+        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200)));
     if (!m_page.Label34.text.trimmed().isEmpty() && !folder.isEmpty())
         line += u"  ·  "_s + wording(u"%1 תמונות"_s, u"%1 pictures"_s).arg(m_page.Label34.text.trimmed());
     m_folder->setText(line);

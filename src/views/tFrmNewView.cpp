@@ -380,9 +380,7 @@ void tFrmNewView::render() {
     m_farTools->setVisible(uncovered && m_page.Picture3.visible);
     m_strip->setVisible(uncovered);
     m_undo->setVisible(m_page.Picture3.visible);
-    m_name->setText(QChar(0x2066) +
-                    m_name->fontMetrics().elidedText(m_page.Title.text, Qt::ElideMiddle, theme().px(260)) +
-                    QChar(0x2069));
+    m_name->setText(fromLeft(m_name->fontMetrics().elidedText(m_page.Title.text, Qt::ElideMiddle, theme().px(260))));
     m_operator->setVisible(state().DegelEdit);
     m_table->render(m_page.Image19.visible ? m_page.Image19.text : QString());
     placePanels();
