@@ -5,6 +5,7 @@
 #include "assembly/PrintFileName.h"
 #include "common/FixedText.h"
 #include "common/ListOutput.h"
+#include "common/OrderNames.h"
 #include "imaging/PictureFile.h"
 #include "platform/HostPath.h"
 
@@ -101,7 +102,7 @@ public:
         checkTotals();
         checkSheet();
         for (const QString& name : namesWith(m_folder, ".jpp")) {
-            if (!name.startsWith(u'!'))
+            if (!IsSheet(name))
                 checkPrintFile(name);
         }
         checkEveryItemIsThere();

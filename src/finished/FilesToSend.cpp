@@ -1,22 +1,13 @@
 #include "finished/FilesToSend.h"
 
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
 #include "common/PieceName.h"
 #include "transfer/OrderDetailsReader.h"
-
-#include <QRegularExpression>
 
 #include <algorithm>
 
 namespace lumora {
-
-namespace {
-
-bool isSheet(const QString& name) {
-    return name.startsWith(u'!');
-}
-
-} // namespace
 
 void FilesToSend::setFolder(const QString& folder) {
     m_folder = folder;
@@ -50,7 +41,7 @@ void FilesToSend::turnMark(int index) {
 
 void FilesToSend::markAll(std::int16_t Mefurak) {
     for (int i = 0; i < m_names.count(); ++i)
-        m_marked[static_cast<std::size_t>(i)] = Mefurak <= 0 || IsPiece(m_names.item(i)) || isSheet(m_names.item(i));
+        m_marked[static_cast<std::size_t>(i)] = Mefurak <= 0 || IsPiece(m_names.item(i)) || IsSheet(m_names.item(i));
 }
 
 QStringList FilesToSend::markedNames() const {
@@ -74,13 +65,13 @@ QStringList FilesToSend::markedPaths() const {
 }
 
 std::optional<QString> FilesToSend::unmarkedSheet() const {
-    if (m_names.isEmpty() || isMarked(0) || !isSheet(m_names.item(0)))
+    if (m_names.isEmpty() || isMarked(0) || !IsSheet(m_names.item(0)))
         return std::nullopt;
     return JoinDrivePath(m_folder, m_names.item(0));
 }
 
 QStringList FilesToSend::resendList() const {
-    const QString text = JoinDrivePath(m_folder, LeafName(m_folder) + QStringLiteral(".txt"));
+    const QString text = OrderTextPath(m_folder);
     QStringList list = markedPaths();
     // It may be among the marked files, and a name that stands twice in an order never arrives twice.
     list.removeAll(text);
@@ -96,19 +87,6 @@ QStringList FilesToSend::mailList() const {
     if (const auto sheet = unmarkedSheet())
         list.prepend(*sheet);
     return list;
-}
-
-std::optional<FinishedOrder> FinishedOrderOf(const QString& folderName) {
-    static const QRegularExpression form(QStringLiteral("^(\\d{4}_\\d{2}_\\d{2})_.*\\^(\\d+)(P?)$"));
-    const QRegularExpressionMatch match = form.match(folderName);
-    const QDate date = QDate::fromString(match.captured(1), QStringLiteral("yyyy_MM_dd"));
-    if (!date.isValid())
-        return std::nullopt;
-    return FinishedOrder{date, match.captured(2), !match.captured(3).isEmpty()};
-}
-
-bool TravelsInPieces(const QString& folderName) {
-    return folderName.endsWith(u'P');
 }
 
 } // namespace lumora

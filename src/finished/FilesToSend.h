@@ -7,8 +7,6 @@
 #include <optional>
 #include <vector>
 
-#include <QDate>
-
 namespace lumora {
 
 // The files of one order folder and which of them are marked to be sent. Reading the folder again takes all marks away.
@@ -56,16 +54,5 @@ private:
     TextList m_names;
     std::vector<bool> m_marked;
 };
-
-// A finished order by the name of its folder, YYYY_MM_DD_SSS_ssss^NNN and a "P" where it travels in pieces.
-struct FinishedOrder {
-    QDate date;
-    QString number;
-    bool pieces = false;
-};
-// No value for a folder with a name of another kind.
-std::optional<FinishedOrder> FinishedOrderOf(const QString& folderName);
-// The sign of an order that travels in pieces: the last letter of its folder's name.
-bool TravelsInPieces(const QString& folderName);
 
 } // namespace lumora

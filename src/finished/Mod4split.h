@@ -12,6 +12,7 @@
 
 namespace lumora {
 
+class Descriptor;
 class Files;
 
 // What became of one file that was to be cut. With a failure or a stop the pieces that are counted stand whole, and the
@@ -59,7 +60,7 @@ public:
     Joined JoinPieces(const QString& piecePath, const QString& outputPath) const;
 
 private:
-    Result<void> writePiece(const QString& path, const class Descriptor& source, qint64 count,
+    Result<void> writePiece(const QString& path, const Descriptor& source, qint64 count,
                             const QString& sourcePath) const;
     Result<qint64> appendPieces(const QString& piecePath, const QString& outputPath, Joined& joined) const;
 

@@ -1,6 +1,7 @@
 #include "finished/MoogMeret.h"
 
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
 #include "imaging/PictureFile.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"

@@ -1,4 +1,5 @@
 // The wording of the page of finished orders, in both languages.
+#include "common/OrderNames.h"
 #include "finished/MoogMeret.h"
 #include "session/SessionState.h"
 

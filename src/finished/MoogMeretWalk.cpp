@@ -1,5 +1,6 @@
 // The walk over the packages of a mail sending.
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
 #include "finished/MailResult.h"
 #include "finished/MoogMeret.h"
 #include "platform/Dialogs.h"
@@ -184,7 +185,7 @@ void MoogMeret::sendPackage(int index) {
 
 OrderDetails MoogMeret::detailsOf(const QString& folder) const {
     OrderDetails details;
-    const QString text = JoinDrivePath(folder, LeafName(folder) + QStringLiteral(".txt"));
+    const QString text = OrderTextPath(folder);
     if (m_platform.files.fileExists(text))
         ReadResentDetails(m_platform.files, text, details);
     return details;

@@ -85,7 +85,7 @@ QString SpltForm::pickFile() {
     return path;
 }
 
-// CollectFiles of the texts: a folder that may not be read is told, the others are listed.
+// A folder that may not be read is told, the others are listed.
 QStringList SpltForm::collect(const QString& folder, Files::Depth depth) {
     QStringList unreadable;
     const QStringList files = m_platform.files.collect(folder, depth, &unreadable);

@@ -33,7 +33,7 @@ public:
     void Command1_Click();                  // "MergeAll"
     void Command4_Click();                  // "Merge": the chosen family, complete or not
     void Command6_Click();                  // "Filelen" of the chosen file
-    void Command5_Click() {}                // "Find Famely": as the design has it, nothing
+    void Command5_Click() {}                // "Find Famely": never did anything
     void List4Bodedim_Click(int index);
     void ListChalakim_Click(int index);
     void Command15_Click(); // stop

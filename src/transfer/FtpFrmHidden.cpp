@@ -1,6 +1,7 @@
 // The hidden area of the sending page: the older bulk path, the chain of orders, the manual panel of the makers, and
 // the routines that nothing calls.
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
 #include "common/PieceName.h"
 #include "platform/Dialogs.h"
 #include "session/Workspace.h"
@@ -15,10 +16,6 @@ namespace {
 
 constexpr int bulkRounds = 3;
 constexpr int bulkConnectFails = 5;
-
-bool isSheet(const QString& path) {
-    return LeafName(path).startsWith(u'!');
-}
 
 } // namespace
 
@@ -41,7 +38,8 @@ void FtpFrm::Command2_Click() {
             }
         };
         append(QStringLiteral("txt"));
-        const auto sheet = std::find_if(m_handedOver.cbegin(), m_handedOver.cend(), isSheet);
+        const auto sheet = std::find_if(m_handedOver.cbegin(), m_handedOver.cend(),
+                                        [](const QString& path) { return IsSheet(LeafName(path)); });
         if (sheet != m_handedOver.cend())
             List3.append(*sheet);
         append(QStringLiteral("prk"));
@@ -287,8 +285,7 @@ void FtpFrm::ListRezefFiles_Click(int index) {
 }
 
 void FtpFrm::PrepareResendHere(const QString& folder) {
-    const QString name = LeafName(folder);
-    const bool pieces = name.endsWith(u'P');
+    const bool pieces = TravelsInPieces(folder);
     File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
     if (pieces)
         m_state.transfer.Mefurak = m_state.transfer.HazmanaP = 1;
@@ -296,12 +293,12 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
     File1.setFolder(folder);
     File1.refresh();
     beginList();
-    const QString log = JoinDrivePath(folder, name + QStringLiteral(".txt"));
+    const QString log = OrderTextPath(folder);
     if (m_platform.files.fileExists(log))
         List3.append(log);
     for (const QString& entry : File1.names()) {
         const QString path = JoinDrivePath(folder, entry);
-        const bool selected = m_state.transfer.Mefurak < 1 || IsPiece(entry) || entry.startsWith(u'!');
+        const bool selected = m_state.transfer.Mefurak < 1 || IsPiece(entry) || IsSheet(entry);
         if (selected && path != log)
             List3.append(path);
     }

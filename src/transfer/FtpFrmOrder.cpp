@@ -1,5 +1,6 @@
 // What the sending page sends: the files of a new order or of a resend, in the order in which they travel.
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
 #include "common/PieceName.h"
 #include "editing/gdisave.h"
 #include "platform/Dialogs.h"
@@ -68,8 +69,7 @@ void FtpFrm::listFolder() {
         for (const QString& name : File1.names())
             List3.append(JoinDrivePath(folder, name));
     } else {
-        const auto sheet = std::find_if(File1.names().begin(), File1.names().end(),
-                                        [](const QString& name) { return name.startsWith(u'!'); });
+        const auto sheet = std::find_if(File1.names().begin(), File1.names().end(), IsSheet);
         // Without a sheet the entry is the folder itself, and its put fails.
         List3.append(JoinDrivePath(folder, sheet == File1.names().end() ? QString() : *sheet));
         for (const QString& name : File1.names()) {

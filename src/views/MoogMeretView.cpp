@@ -1,6 +1,8 @@
 #include "views/MoogMeretView.h"
 
 #include "common/DrivePathText.h"
+#include "common/OrderNames.h"
+#include "finished/FinishedOrder.h"
 #include "views/Gauge.h"
 #include "views/ScrolledPicture.h"
 
@@ -113,8 +115,7 @@ QWidget* MoogMeretView::makeFiles() {
     m_fileList->setTextElideMode(Qt::ElideMiddle);
     m_fileList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     whenPicked(m_fileList, [&page = m_page](int row) { page.File1_Click(row); });
-    bindList(u"File1"_s, m_page.File1.names(), m_fileList,
-             [](const QString& name) { return QChar(0x2066) + name + QChar(0x2069); });
+    bindList(u"File1"_s, m_page.File1.names(), m_fileList, [](const QString& name) { return fromLeft(name); });
     column->addWidget(m_fileList, 1);
     m_counts = makeLabel(card, "muted");
     bind(u"Label5"_s, m_counts, [this] { return m_page.Label5.text; });
@@ -146,12 +147,10 @@ QWidget* MoogMeretView::makeWays() {
     column->addStretch(1);
     m_pickFirst = label(u"Label4Shalav3"_s, m_page.Label4Shalav3, "strong");
     column->addWidget(m_pickFirst);
-    m_resend = button(
-        u"Command4"_s, m_page.Command4, Role::Main, [this] { m_page.Command4_Click(); }, u"send"_s);
-    m_mail = button(
-        u"Command2"_s, m_page.Command2, Role::Secondary, [this] { m_page.Command2_Click(); }, u"mail"_s);
-    column->addWidget(m_resend);
-    column->addWidget(m_mail);
+    column->addWidget(button(
+        u"Command4"_s, m_page.Command4, Role::Main, [this] { m_page.Command4_Click(); }, u"send"_s));
+    column->addWidget(button(
+        u"Command2"_s, m_page.Command2, Role::Secondary, [this] { m_page.Command2_Click(); }, u"mail"_s));
     m_ways->setFixedWidth(m_preview->width());
     return m_ways;
 }
@@ -191,8 +190,7 @@ QWidget* MoogMeretView::makeWalk() {
     m_packages = new QListWidget(m_walk);
     m_packages->setTextElideMode(Qt::ElideMiddle);
     whenPicked(m_packages, [&page = m_page](int at) { page.List1_Click(at); });
-    bindList(u"List1"_s, m_page.List1, m_packages,
-             [](const QString& path) { return QChar(0x2066) + LeafName(path) + QChar(0x2069); });
+    bindList(u"List1"_s, m_page.List1, m_packages, [](const QString& path) { return fromLeft(LeafName(path)); });
     column->addWidget(m_packages, 4);
     centred(label(u"Label24"_s, m_page.Label24, "muted"));
     return m_walk;

@@ -53,8 +53,6 @@ private:
     QFrame* m_answer = nullptr;
     QLabel* m_answerSign = nullptr;
     QListWidget* m_packages = nullptr;
-    QPushButton* m_resend = nullptr;
-    QPushButton* m_mail = nullptr;
 };
 
 } // namespace lumora

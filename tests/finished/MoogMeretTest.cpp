@@ -1,6 +1,7 @@
 #include "finished/MoogMeret.h"
 
 #include "common/ListOutput.h"
+#include "finished/FinishedOrder.h"
 #include "finished/MailResult.h"
 #include "imaging/PictureFile.h"
 #include "session/PageChain.h"
