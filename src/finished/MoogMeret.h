@@ -148,7 +148,6 @@ private:
     void showOutcome();
     bool mailSetUp() const;
     OrderDetails detailsOf(const QString& folder) const;
-    QString mailBody(const QString& path) const;
     void leaveProgram();
 
     SessionState& m_state;

@@ -1,6 +1,7 @@
 // The walk over the packages of a mail sending.
 #include "common/DrivePathText.h"
 #include "common/OrderNames.h"
+#include "finished/MailLetter.h"
 #include "finished/MailResult.h"
 #include "finished/MoogMeret.h"
 #include "platform/Dialogs.h"
@@ -169,9 +170,11 @@ void MoogMeret::sendPackage(int index) {
                                       QStringLiteral("Sending the package. Please wait."));
     Label4Doar.hint.clear();
     Q_EMIT changed();
+    const QString order = FolderOfPath(path);
+    const QString letter = MailLetter(m_state, detailsOf(order), LeafName(path), Label4Mana.text);
     MailOutcome outcome;
     if (const auto file = m_platform.files.drives().toHost(path))
-        outcome = m_platform.mail.send(m_state.profile.mail, {LeafName(FolderOfPath(path)), mailBody(path), *file});
+        outcome = m_platform.mail.send(m_state.profile.mail, {LeafName(order), letter, *file});
     else
         outcome = {MailEnd::AttachmentMissing, path};
     m_sending = false;
@@ -189,22 +192,6 @@ OrderDetails MoogMeret::detailsOf(const QString& folder) const {
     if (m_platform.files.fileExists(text))
         ReadResentDetails(m_platform.files, text, details);
     return details;
-}
-
-QString MoogMeret::mailBody(const QString& path) const {
-    const OrderDetails details = detailsOf(FolderOfPath(path));
-    const auto line = [this](const QString& hebrew, const QString& english, const QString& value) {
-        return value.trimmed().isEmpty() ? QString()
-                                         : m_state.wording(hebrew, english) + QStringLiteral(": ") + value + u'\n';
-    };
-    return line(QStringLiteral("שם"), QStringLiteral("Name"), details.n1) +
-           line(QStringLiteral("טלפון"), QStringLiteral("Telephone"), details.n2) +
-           line(QStringLiteral("דואר אלקטרוני"), QStringLiteral("E-mail"), details.Mail) +
-           line(QStringLiteral("נייר"), QStringLiteral("Paper"),
-                QStringList{details.ppr, details.maat, details.Bord, details.FillFit}.join(u' ')) +
-           line(QStringLiteral("הערות"), QStringLiteral("Remarks"), details.Hearot) +
-           line(QStringLiteral("סך תמונות"), QStringLiteral("Total pictures"), QString::number(details.TotalPics)) +
-           line(QStringLiteral("קובץ"), QStringLiteral("File"), LeafName(path)) + Label4Mana.text + u'\n';
 }
 
 void MoogMeret::showWalk() {
