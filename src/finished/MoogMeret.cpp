@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "common/OrderNames.h"
+#include "finished/UnreadableFolders.h"
 #include "imaging/PictureFile.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"
@@ -149,10 +150,7 @@ void MoogMeret::showOrder(const QString& folder) {
     Label4Lakoach.text = m_state.wording(QStringLiteral("לקוח: %1"), QStringLiteral("Customer: %1")).arg(customer);
     QStringList unreadable;
     m_platform.files.collect(folder, Files::Depth::ThisFolder, &unreadable);
-    if (!unreadable.isEmpty())
-        m_platform.dialogs.message(m_state.wording(QStringLiteral("אין אפשרות לקרוא תיקייה זו:"),
-                                                   QStringLiteral("This folder can't be read:")) +
-                                   u'\n' + unreadable.join(u'\n'));
+    TellUnreadableFolders(m_state, m_platform.dialogs, unreadable);
 }
 
 // A first file that is no picture, as a print file or a piece, leaves the window empty.

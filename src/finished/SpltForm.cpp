@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "common/PieceName.h"
+#include "finished/UnreadableFolders.h"
 #include "platform/Dialogs.h"
 #include "platform/Files.h"
 #include "platform/Machine.h"
@@ -89,10 +90,7 @@ QString SpltForm::pickFile() {
 QStringList SpltForm::collect(const QString& folder, Files::Depth depth) {
     QStringList unreadable;
     const QStringList files = m_platform.files.collect(folder, depth, &unreadable);
-    if (!unreadable.isEmpty())
-        m_platform.dialogs.message(
-            wording(QStringLiteral("אין אפשרות לקרוא תיקייה זו:"), QStringLiteral("This folder can't be read:")) +
-            u'\n' + unreadable.join(u'\n'));
+    TellUnreadableFolders(m_state, m_platform.dialogs, unreadable);
     return files;
 }
 
