@@ -27,11 +27,11 @@ function(lumora_uses target)
   endforeach()
 endfunction()
 
-# lumora_floor(NAME USES floors and libraries...): the library floor_NAME from all sources of this folder but main.cpp, which a program
+# lumora_floor(NAME USES floors and libraries...): the library floor_NAME from all sources of this folder and those below it but main.cpp, which a program
 # beside the library adds to it.
 function(lumora_floor name)
   cmake_parse_arguments(FLOOR "" "" "USES" ${ARGN})
-  file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.h ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
+  file(GLOB_RECURSE sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.h ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
   list(FILTER sources EXCLUDE REGEX "/main\\.cpp$")
   add_library(floor_${name} STATIC ${sources})
   set(include_root ${CMAKE_BINARY_DIR}/include/${name})

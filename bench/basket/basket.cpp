@@ -1,7 +1,7 @@
 // The steps that a customer feels on the page of pictures, with 5,000 pictures found and as many in the basket. Each
 // should stay under 1 ms; adding a folder is one step for all its files.
 #include "selection/Basket.h"
-#include "editing/EditRecord.h"
+#include "order/EditRecord.h"
 #include "selection/FolderPager.h"
 
 #include <benchmark/benchmark.h>

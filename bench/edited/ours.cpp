@@ -3,9 +3,9 @@
 #include "Floor.h"
 #include "Job.h"
 
-#include "editing/EditRecord.h"
-#include "editing/EditedPicture.h"
+#include "editing/render/EditedPicture.h"
 #include "imaging/PictureMemory.h"
+#include "order/EditRecord.h"
 #include "session/SessionState.h"
 
 #include <QGuiApplication>

@@ -2,9 +2,9 @@
 // what opening the picture takes beside the scaled decode alone. Times are processor time of this thread.
 #include "Floor.h"
 #include "Timing.h"
-#include "editing/EditRecord.h"
-#include "editing/EditedPicture.h"
-#include "imaging/Resample.h"
+#include "editing/render/EditedPicture.h"
+#include "imaging/scaling/Resample.h"
+#include "order/EditRecord.h"
 #include "session/SessionState.h"
 
 #include <QGuiApplication>

@@ -4,7 +4,7 @@
 // scaling between.
 
 #include "Floor.h"
-#include "imaging/Resample.h"
+#include "imaging/scaling/Resample.h"
 
 #include <cmath>
 #include <cstdlib>

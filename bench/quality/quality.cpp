@@ -2,9 +2,9 @@
 // the exact picture encoded in the same way.
 
 #include "Floor.h"
-#include "imaging/JpegWriter.h"
-#include "imaging/PlaneScaler.h"
-#include "imaging/Resample.h"
+#include "imaging/files/JpegWriter.h"
+#include "imaging/scaling/PlaneScaler.h"
+#include "imaging/scaling/Resample.h"
 
 #include <QTemporaryDir>
 

@@ -4,7 +4,7 @@
 
 #include "Timing.h"
 #include "common/HostFile.h"
-#include "editing/RedI.h"
+#include "editing/redeye/RedI.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/SamplePhotographs.h"

@@ -1,8 +1,8 @@
 // The stages of the picture path, one picture of 12 megapixels: what each costs, and each kind of vectors.
 
 #include "Floor.h"
-#include "imaging/JpegWriter.h"
-#include "imaging/Resample.h"
+#include "imaging/files/JpegWriter.h"
+#include "imaging/scaling/Resample.h"
 #include "support/SamplePhotographs.h"
 
 #include <QTemporaryDir>

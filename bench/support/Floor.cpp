@@ -1,6 +1,6 @@
 #include "Floor.h"
 
-#include "imaging/JpegWriter.h"
+#include "imaging/files/JpegWriter.h"
 
 #include <QTemporaryDir>
 

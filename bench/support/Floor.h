@@ -1,6 +1,6 @@
 #pragma once
 
-#include "imaging/JpegReader.h"
+#include "imaging/files/JpegReader.h"
 #include "support/ReferenceScaling.h"
 
 #include <QByteArray>

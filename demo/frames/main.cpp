@@ -1,7 +1,7 @@
 #include "FrameArt.h"
 
 #include "imaging/Bitmap.h"
-#include "imaging/PlacedDraw.h"
+#include "imaging/drawing/PlacedDraw.h"
 
 #include <QDir>
 #include <QGuiApplication>

@@ -1,6 +1,6 @@
-#include "editing/EditRecord.h"
+#include "order/EditRecord.h"
 
-#include "editing/EditedPicture.h"
+#include "editing/render/EditedPicture.h"
 #include "session/SessionState.h"
 
 #include <QDir>

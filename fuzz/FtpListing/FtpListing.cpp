@@ -1,4 +1,4 @@
-#include "platform/FtpListing.h"
+#include "platform/line/FtpListing.h"
 
 #include <cstdint>
 #include <cstdlib>

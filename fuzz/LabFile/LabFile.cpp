@@ -1,5 +1,5 @@
-#include "session/LabFile.h"
-#include "session/ClientProfile.h"
+#include "session/lab/LabFile.h"
+#include "session/lab/ClientProfile.h"
 
 #include <cstdint>
 #include <cstdlib>

@@ -1,7 +1,7 @@
-#include "assembly/PrintFile.h"
+#include "order/PrintFile.h"
 
-#include "assembly/OrderTail.h"
-#include "assembly/PrintFileName.h"
+#include "order/OrderTail.h"
+#include "order/PrintFileName.h"
 
 #include <cstdint>
 #include <cstdlib>

@@ -1,4 +1,4 @@
-#include "transfer/ServerList.h"
+#include "transfer/http/ServerList.h"
 #include "common/AnsiCodePage.h"
 
 #include <cstddef>

@@ -1,4 +1,4 @@
-#include "session/SettingsText.h"
+#include "session/lab/SettingsText.h"
 
 #include "common/AnsiCodePage.h"
 

@@ -1,6 +1,6 @@
 #include "app/DesktopShell.h"
 
-#include "platform/Drives.h"
+#include "platform/files/Drives.h"
 
 #include <QClipboard>
 #include <QDesktopServices>

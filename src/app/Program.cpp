@@ -2,20 +2,20 @@
 
 #include "app/DesktopShell.h"
 #include "app/PageRegister.h"
-#include "platform/Drives.h"
-#include "platform/Files.h"
 #include "platform/Instances.h"
 #include "platform/Platform.h"
-#include "platform/PocoInternet.h"
 #include "platform/QtEventPump.h"
-#include "platform/SmtpMail.h"
-#include "platform/StatVolume.h"
 #include "platform/SystemClock.h"
-#include "session/LabFile.h"
+#include "platform/files/Drives.h"
+#include "platform/files/Files.h"
+#include "platform/files/StatVolume.h"
+#include "platform/line/PocoInternet.h"
+#include "platform/line/SmtpMail.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/MainWindow.h"
-#include "views/ScreenDialogs.h"
+#include "session/lab/LabFile.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <QCoreApplication>
 #include <QGuiApplication>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
-#include "platform/HostPath.h"
+#include "platform/files/HostPath.h"
 
 #include <QSize>
 

@@ -2,7 +2,7 @@
 
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 
 #include <QDateTime>
 #include <QStringList>

@@ -1,7 +1,7 @@
 #include "assembly/PaperResize.h"
 
 #include "common/FixedText.h"
-#include "platform/HostPath.h"
+#include "platform/files/HostPath.h"
 
 #include <algorithm>
 

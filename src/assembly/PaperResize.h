@@ -1,8 +1,8 @@
 #pragma once
 
 #include "common/Result.h"
-#include "editing/PicturePlacement.h"
-#include "imaging/PictureFile.h"
+#include "editing/render/PicturePlacement.h"
+#include "imaging/files/PictureFile.h"
 
 #include <QByteArray>
 

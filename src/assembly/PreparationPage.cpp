@@ -1,10 +1,10 @@
 #include "assembly/PreparationPage.h"
 
-#include "assembly/OrderItem.h"
+#include "order/OrderItem.h"
 #include "platform/Dialogs.h"
-#include "platform/Files.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"

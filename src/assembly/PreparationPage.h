@@ -1,9 +1,9 @@
 #pragma once
 
-#include "assembly/OrderFolder.h"
 #include "assembly/PrintPacker.h"
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
+#include "order/OrderFolder.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"

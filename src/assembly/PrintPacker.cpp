@@ -1,7 +1,7 @@
 #include "assembly/PrintPacker.h"
 
-#include "assembly/PrintFileName.h"
-#include "platform/Files.h"
+#include "order/PrintFileName.h"
+#include "platform/files/Files.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 

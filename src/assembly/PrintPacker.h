@@ -1,9 +1,9 @@
 #pragma once
 
-#include "assembly/OrderFolder.h"
-#include "assembly/OrderTail.h"
-#include "assembly/PrintFile.h"
 #include "common/Result.h"
+#include "order/OrderFolder.h"
+#include "order/OrderTail.h"
+#include "order/PrintFile.h"
 
 #include <QByteArray>
 #include <QString>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "common/HostFile.h"
-#include "platform/HostPath.h"
+#include "platform/files/HostPath.h"
 
 namespace lumora {
 

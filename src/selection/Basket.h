@@ -1,6 +1,6 @@
 #pragma once
 
-#include "selection/PrintCode.h"
+#include "order/PrintCode.h"
 #include "session/TextList.h"
 
 #include <QHash>

@@ -2,7 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
-#include "platform/Files.h"
+#include "platform/files/Files.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 
 #include <QString>
 

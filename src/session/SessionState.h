@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Mail.h"
+#include "platform/line/Mail.h"
 
 #include <QDateTime>
 #include <QString>

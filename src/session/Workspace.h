@@ -1,7 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
-#include "platform/Files.h"
+#include "platform/files/Files.h"
 
 #include <QString>
 

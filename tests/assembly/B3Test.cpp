@@ -1,7 +1,7 @@
 #include "EditedOrder.h"
 
-#include "assembly/OrderCheck.h"
-#include "editing/EditedPicture.h"
+#include "editing/render/EditedPicture.h"
+#include "order/OrderCheck.h"
 #include "support/SmallDisk.h"
 
 #include <QCoreApplication>

@@ -2,11 +2,11 @@
 
 #include "PlainOrder.h"
 
-#include "assembly/B3.h"
+#include "assembly/edited/B3.h"
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
-#include "editing/EditRecord.h"
-#include "editing/gdisave.h"
+#include "editing/editor/gdisave.h"
+#include "order/EditRecord.h"
 
 namespace lumora {
 

@@ -1,8 +1,8 @@
 #include "PlainOrder.h"
 
-#include "assembly/OrderCheck.h"
 #include "assembly/PaperResize.h"
 #include "common/AnsiCodePage.h"
+#include "order/OrderCheck.h"
 
 #include <QCoreApplication>
 #include <QCryptographicHash>

@@ -1,4 +1,4 @@
-#include "assembly/OrderCheck.h"
+#include "order/OrderCheck.h"
 
 #include "PlainOrder.h"
 

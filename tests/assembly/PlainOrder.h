@@ -1,8 +1,8 @@
 #pragma once
 
-#include "assembly/Form2.h"
-#include "assembly/PrintFile.h"
-#include "imaging/PictureFile.h"
+#include "assembly/plain/Form2.h"
+#include "imaging/files/PictureFile.h"
+#include "order/PrintFile.h"
 #include "support/ExampleOrder.h"
 #include "support/PageRig.h"
 

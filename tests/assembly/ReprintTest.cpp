@@ -1,7 +1,7 @@
 #include "EditedOrder.h"
 
-#include "assembly/OrderCheck.h"
 #include "common/ListOutput.h"
+#include "order/OrderCheck.h"
 
 #include <QDir>
 #include <QMap>

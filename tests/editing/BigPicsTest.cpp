@@ -1,6 +1,6 @@
-#include "editing/BigPics.h"
-#include "editing/Form3.h"
-#include "imaging/PictureFile.h"
+#include "editing/editor/BigPics.h"
+#include "editing/editor/Form3.h"
+#include "imaging/files/PictureFile.h"
 #include "support/PageRig.h"
 
 #include <gtest/gtest.h>

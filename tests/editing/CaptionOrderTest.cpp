@@ -1,5 +1,5 @@
-#include "imaging/CaptionDraw.h"
-#include "imaging/Drawing.h"
+#include "imaging/drawing/CaptionDraw.h"
+#include "imaging/drawing/Drawing.h"
 
 #include <QFont>
 #include <QFontMetricsF>

@@ -1,7 +1,7 @@
-#include "editing/EditedPicture.h"
-#include "editing/EditRecord.h"
-#include "imaging/CaptionDraw.h"
-#include "imaging/Resample.h"
+#include "editing/render/EditedPicture.h"
+#include "imaging/drawing/CaptionDraw.h"
+#include "imaging/scaling/Resample.h"
+#include "order/EditRecord.h"
 #include "session/SessionState.h"
 
 #include <QDir>

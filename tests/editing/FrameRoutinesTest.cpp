@@ -1,7 +1,7 @@
 // The routines around frames and channels that no page calls.
-#include "editing/ChannelMinimums.h"
-#include "editing/FrameScramble.h"
-#include "editing/LineFrame.h"
+#include "editing/render/ChannelMinimums.h"
+#include "editing/render/FrameScramble.h"
+#include "editing/render/LineFrame.h"
 #include "imaging/Bitmap.h"
 #include "session/SessionState.h"
 #include "support/TestPlatform.h"

@@ -1,4 +1,4 @@
-#include "editing/KeyLayout.h"
+#include "editing/caption/KeyLayout.h"
 
 #include "common/AnsiCodePage.h"
 

@@ -1,4 +1,4 @@
-#include "editing/PicturePlacement.h"
+#include "editing/render/PicturePlacement.h"
 #include "session/SessionState.h"
 
 #include <gtest/gtest.h>

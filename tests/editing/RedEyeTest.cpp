@@ -1,4 +1,4 @@
-#include "editing/RedEye.h"
+#include "editing/redeye/RedEye.h"
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
-#include "editing/RedI.h"
+#include "editing/redeye/RedI.h"
 
-#include "editing/BigPics.h"
-#include "editing/EditRecord.h"
-#include "editing/RedEye.h"
-#include "editing/RedOverview.h"
-#include "editing/tFrmNew.h"
+#include "editing/editor/BigPics.h"
+#include "editing/editor/tFrmNew.h"
+#include "editing/redeye/RedEye.h"
+#include "editing/redeye/RedOverview.h"
+#include "order/EditRecord.h"
 #include "support/PageRig.h"
 
 #include <gtest/gtest.h>

@@ -2,11 +2,11 @@
 
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
-#include "editing/BigPics.h"
-#include "editing/EditRecord.h"
-#include "editing/mikledet.h"
-#include "editing/tFrmNew.h"
-#include "imaging/PictureFile.h"
+#include "editing/caption/mikledet.h"
+#include "editing/editor/BigPics.h"
+#include "editing/editor/tFrmNew.h"
+#include "imaging/files/PictureFile.h"
+#include "order/EditRecord.h"
 #include "session/Workspace.h"
 #include "support/PageRig.h"
 

@@ -1,6 +1,6 @@
-#include "editing/gdisave.h"
+#include "editing/editor/gdisave.h"
 
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 #include "support/PageRig.h"
 
 #include <gtest/gtest.h>

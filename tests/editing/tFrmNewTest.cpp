@@ -1,6 +1,6 @@
 #include "TheEditor.h"
 
-#include "editing/EditedPicture.h"
+#include "editing/render/EditedPicture.h"
 
 namespace lumora {
 namespace {

@@ -1,4 +1,4 @@
-#include "entry/DetailStore.h"
+#include "entry/details/DetailStore.h"
 
 #include "DetailsPageTest.h"
 

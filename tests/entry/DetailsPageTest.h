@@ -1,9 +1,9 @@
 #pragma once
 
-#include "entry/Havharot.h"
-#include "entry/nnn.h"
-#include "session/ClientProfile.h"
-#include "session/Deployment.h"
+#include "entry/details/nnn.h"
+#include "entry/notice/Havharot.h"
+#include "session/lab/ClientProfile.h"
+#include "session/lab/Deployment.h"
 #include "support/PageRig.h"
 
 #include <gtest/gtest.h>

@@ -1,8 +1,8 @@
-#include "entry/DetailStore.h"
-#include "entry/DetailsCheck.h"
-#include "entry/TileMenu.h"
-#include "entry/TimeOfJob.h"
-#include "entry/VolumeMark.h"
+#include "entry/details/DetailStore.h"
+#include "entry/details/DetailsCheck.h"
+#include "entry/details/TileMenu.h"
+#include "entry/details/TimeOfJob.h"
+#include "entry/details/VolumeMark.h"
 
 #include "common/DrivePathText.h"
 #include "session/SessionState.h"

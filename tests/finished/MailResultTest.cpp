@@ -1,4 +1,4 @@
-#include "finished/MailResult.h"
+#include "finished/mail/MailResult.h"
 
 #include <QList>
 #include <QStringList>

@@ -1,6 +1,6 @@
-#include "finished/Mod4split.h"
+#include "finished/pieces/Mod4split.h"
 
-#include "common/PieceName.h"
+#include "order/PieceName.h"
 #include "support/SmallDisk.h"
 #include "support/TestPlatform.h"
 

@@ -1,9 +1,9 @@
-#include "finished/MoogMeret.h"
+#include "finished/orders/MoogMeret.h"
 
 #include "common/ListOutput.h"
-#include "finished/FinishedOrder.h"
-#include "finished/MailResult.h"
-#include "imaging/PictureFile.h"
+#include "finished/mail/MailResult.h"
+#include "imaging/files/PictureFile.h"
+#include "order/FinishedOrder.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/TestPlatform.h"

@@ -1,4 +1,4 @@
-#include "finished/SpltForm.h"
+#include "finished/pieces/SpltForm.h"
 
 #include "support/PageRig.h"
 #include "support/SmallDisk.h"

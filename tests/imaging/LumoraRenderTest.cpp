@@ -1,6 +1,6 @@
 #include "JpegOfKind.h"
 #include "common/HostFile.h"
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 
 #include <QDir>
 #include <QFile>

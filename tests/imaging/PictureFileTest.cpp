@@ -1,4 +1,4 @@
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 
 #include "JpegOfKind.h"
 #include "common/HostFile.h"

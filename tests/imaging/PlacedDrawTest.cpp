@@ -1,6 +1,6 @@
-#include "imaging/PlacedDraw.h"
+#include "imaging/drawing/PlacedDraw.h"
 
-#include "imaging/Resample.h"
+#include "imaging/scaling/Resample.h"
 
 #include <QPainter>
 

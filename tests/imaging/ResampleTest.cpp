@@ -1,9 +1,9 @@
-#include "imaging/Resample.h"
+#include "imaging/scaling/Resample.h"
 
 #include "JpegOfKind.h"
 #include "common/HostFile.h"
-#include "imaging/Drawing.h"
-#include "imaging/PlaneScaler.h"
+#include "imaging/drawing/Drawing.h"
+#include "imaging/scaling/PlaneScaler.h"
 #include "support/ReferenceScaling.h"
 #include "support/SamplePhotographs.h"
 

@@ -1,4 +1,4 @@
-#include "platform/Files.h"
+#include "platform/files/Files.h"
 #include "support/SmallDisk.h"
 
 #include <QTemporaryDir>

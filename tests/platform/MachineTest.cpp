@@ -1,5 +1,5 @@
 #include "platform/QtEventPump.h"
-#include "platform/StatVolume.h"
+#include "platform/files/StatVolume.h"
 
 #include <QCoreApplication>
 #include <QElapsedTimer>

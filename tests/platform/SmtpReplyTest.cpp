@@ -1,4 +1,4 @@
-#include "platform/SmtpReply.h"
+#include "platform/line/SmtpReply.h"
 
 #include <gtest/gtest.h>
 

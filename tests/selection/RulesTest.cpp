@@ -1,4 +1,4 @@
-#include "editing/EditRecord.h"
+#include "order/EditRecord.h"
 #include "selection/Basket.h"
 #include "selection/FinishRule.h"
 #include "selection/FolderPager.h"

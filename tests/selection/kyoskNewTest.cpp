@@ -1,11 +1,11 @@
-#include "selection/kyoskNew.h"
+#include "selection/pictures/kyoskNew.h"
 
 #include "common/DrivePathText.h"
-#include "editing/BigPics.h"
-#include "editing/EditRecord.h"
-#include "editing/StoredSmallView.h"
-#include "editing/tFrmNew.h"
-#include "imaging/PictureFile.h"
+#include "editing/editor/BigPics.h"
+#include "editing/editor/tFrmNew.h"
+#include "editing/render/StoredSmallView.h"
+#include "imaging/files/PictureFile.h"
+#include "order/EditRecord.h"
 #include "session/Workspace.h"
 #include "support/PageRig.h"
 

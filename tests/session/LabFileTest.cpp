@@ -1,6 +1,6 @@
-#include "session/LabFile.h"
+#include "session/lab/LabFile.h"
 
-#include "session/ClientProfile.h"
+#include "session/lab/ClientProfile.h"
 
 #include <QFile>
 #include <QTemporaryDir>

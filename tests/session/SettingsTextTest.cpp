@@ -1,6 +1,6 @@
-#include "session/SettingsText.h"
+#include "session/lab/SettingsText.h"
 
-#include "session/Deployment.h"
+#include "session/lab/Deployment.h"
 
 #include <gtest/gtest.h>
 

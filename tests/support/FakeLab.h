@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Internet.h"
+#include "platform/line/Internet.h"
 
 #include <QByteArray>
 #include <QStringList>

@@ -1,13 +1,13 @@
 #pragma once
 
 #include "common/ListOutput.h"
-#include "editing/gdisave.h"
+#include "editing/editor/gdisave.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "support/TestPlatform.h"
-#include "transfer/FtpFrm.h"
-#include "transfer/InetForm.h"
+#include "transfer/ftp/FtpFrm.h"
+#include "transfer/report/InetForm.h"
 
 #include <map>
 

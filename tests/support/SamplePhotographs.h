@@ -1,7 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
-#include "imaging/PictureFile.h"
+#include "imaging/files/PictureFile.h"
 
 #include <QByteArray>
 

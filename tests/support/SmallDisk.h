@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/HostPath.h"
+#include "platform/files/HostPath.h"
 
 #include <QTemporaryDir>
 

@@ -1,13 +1,13 @@
 #pragma once
 
 #include "platform/Dialogs.h"
-#include "platform/Drives.h"
-#include "platform/Files.h"
 #include "platform/Instances.h"
-#include "platform/Internet.h"
 #include "platform/Machine.h"
-#include "platform/Mail.h"
 #include "platform/Platform.h"
+#include "platform/files/Drives.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
+#include "platform/line/Mail.h"
 
 #include <QStringList>
 #include <QTemporaryDir>

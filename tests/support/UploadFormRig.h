@@ -3,7 +3,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/TestPlatform.h"
-#include "transfer/UploadForm.h"
+#include "transfer/http/UploadForm.h"
 
 #include <map>
 

@@ -1,4 +1,4 @@
-#include "transfer/FtpSession.h"
+#include "transfer/ftp/FtpSession.h"
 #include "support/FakeLab.h"
 #include "support/TestPlatform.h"
 

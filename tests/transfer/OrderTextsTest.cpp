@@ -1,10 +1,10 @@
+#include "order/BrokenFiles.h"
+#include "order/OrderDetailsReader.h"
+#include "order/OrderReport.h"
 #include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
-#include "transfer/BrokenFiles.h"
-#include "transfer/OrderDetailsReader.h"
-#include "transfer/OrderReport.h"
-#include "transfer/OrderSummary.h"
-#include "transfer/UploadProgress.h"
+#include "transfer/delivery/OrderSummary.h"
+#include "transfer/delivery/UploadProgress.h"
 
 #include "session/TextList.h"
 

@@ -1,7 +1,7 @@
-#include "transfer/UploadScript.h"
+#include "transfer/http/UploadScript.h"
 #include "support/FakeWebLab.h"
 #include "support/TestPlatform.h"
-#include "transfer/ServerList.h"
+#include "transfer/http/ServerList.h"
 
 #include <gtest/gtest.h>
 

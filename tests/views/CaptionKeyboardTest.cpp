@@ -1,10 +1,10 @@
 #include "PageLook.h"
 
-#include "editing/mikledet.h"
+#include "editing/caption/mikledet.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/MainWindow.h"
-#include "views/PageView.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 
 #include <QTest>
 #include <QWidget>

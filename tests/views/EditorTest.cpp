@@ -1,11 +1,11 @@
 #include "PageLook.h"
 
-#include "editing/tFrmNew.h"
-#include "selection/kyoskNew.h"
+#include "editing/editor/tFrmNew.h"
+#include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/MainWindow.h"
-#include "views/PageView.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 
 #include <QApplication>
 #include <QTest>

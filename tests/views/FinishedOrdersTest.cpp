@@ -1,14 +1,14 @@
 #include "PageLook.h"
 
-#include "finished/MoogMeret.h"
-#include "imaging/PictureFile.h"
-#include "platform/Files.h"
+#include "finished/orders/MoogMeret.h"
+#include "imaging/files/PictureFile.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "transfer/FtpFrm.h"
-#include "views/ScreenDialogs.h"
+#include "transfer/ftp/FtpFrm.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <QPainter>
 

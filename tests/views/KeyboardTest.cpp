@@ -1,12 +1,12 @@
 #include "Walk.h"
 
-#include "entry/nnn.h"
-#include "selection/kyoskNew.h"
+#include "entry/details/nnn.h"
+#include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "transfer/FtpFrm.h"
-#include "views/MainWindow.h"
-#include "views/ScreenDialogs.h"
+#include "transfer/ftp/FtpFrm.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <QApplication>
 #include <QTest>

@@ -1,9 +1,9 @@
 #include "Walk.h"
 
-#include "entry/nnn.h"
+#include "entry/details/nnn.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/MainWindow.h"
+#include "views/window/MainWindow.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "views/Application.h"
+#include "views/window/Application.h"
 
 #include <gtest/gtest.h>
 

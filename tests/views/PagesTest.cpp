@@ -1,14 +1,14 @@
 #include "PageLook.h"
 
-#include "assembly/B3.h"
-#include "editing/EditRecord.h"
-#include "entry/nnn.h"
+#include "assembly/edited/B3.h"
+#include "entry/details/nnn.h"
+#include "order/EditRecord.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "transfer/FtpFrm.h"
-#include "views/MainWindow.h"
-#include "views/Overlay.h"
-#include "views/ScreenDialogs.h"
+#include "transfer/ftp/FtpFrm.h"
+#include "views/kit/Overlay.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <gtest/gtest.h>
 

@@ -2,9 +2,9 @@
 
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/HoldButton.h"
-#include "views/MainWindow.h"
-#include "views/PageView.h"
+#include "views/kit/HoldButton.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 
 #include <QApplication>
 #include <QPushButton>

@@ -1,15 +1,15 @@
 #include "PageLook.h"
 
-#include "editing/RedEye.h"
-#include "editing/RedI.h"
-#include "imaging/PictureFile.h"
-#include "platform/Files.h"
+#include "editing/redeye/RedEye.h"
+#include "editing/redeye/RedI.h"
+#include "imaging/files/PictureFile.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/SamplePhotographs.h"
-#include "views/MainWindow.h"
-#include "views/PageView.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 
 #include <QPainter>
 #include <QTest>

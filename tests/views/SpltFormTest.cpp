@@ -1,12 +1,12 @@
 #include "PageLook.h"
 
-#include "finished/SpltForm.h"
-#include "platform/Files.h"
+#include "finished/pieces/SpltForm.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/MainWindow.h"
-#include "views/ScreenDialogs.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <gtest/gtest.h>
 

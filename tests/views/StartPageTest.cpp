@@ -1,13 +1,13 @@
 #include "PageLook.h"
 
-#include "platform/Files.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "session/hatchala.h"
+#include "start/hatchala.h"
 #include "support/SamplePhotographs.h"
-#include "views/MainWindow.h"
-#include "views/PageView.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 
 #include <QApplication>
 #include <QLabel>

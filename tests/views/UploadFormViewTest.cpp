@@ -1,12 +1,12 @@
 #include "PageLook.h"
 
-#include "platform/Files.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/LabServers.h"
-#include "transfer/UploadForm.h"
-#include "views/MainWindow.h"
+#include "transfer/http/UploadForm.h"
+#include "views/window/MainWindow.h"
 
 #include <QTest>
 

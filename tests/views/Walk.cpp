@@ -1,15 +1,15 @@
 #include "Walk.h"
 
-#include "imaging/PictureFile.h"
-#include "platform/Files.h"
+#include "imaging/files/PictureFile.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/SamplePhotographs.h"
-#include "views/MainWindow.h"
-#include "views/Overlay.h"
-#include "views/PageView.h"
-#include "views/ScreenDialogs.h"
+#include "views/kit/Overlay.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <QAbstractButton>
 #include <QAbstractItemModel>

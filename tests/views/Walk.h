@@ -1,8 +1,8 @@
 #pragma once
 
 #include "app/Program.h"
+#include "drive/ControlFinder.h"
 #include "session/Page.h"
-#include "views/ControlFinder.h"
 
 #include <QSize>
 #include <QString>

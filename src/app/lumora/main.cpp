@@ -1,7 +1,7 @@
 #include "app/Program.h"
 #include "imaging/PictureMemory.h"
-#include "views/Application.h"
-#include "views/StartFailure.h"
+#include "views/window/Application.h"
+#include "views/window/StartFailure.h"
 
 #include <QByteArrayList>
 #include <QCommandLineParser>

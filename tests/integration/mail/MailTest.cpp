@@ -1,5 +1,5 @@
-#include "finished/MailResult.h"
-#include "platform/SmtpMail.h"
+#include "finished/mail/MailResult.h"
+#include "platform/line/SmtpMail.h"
 #include "support/LabServers.h"
 #include "support/MailServer.h"
 

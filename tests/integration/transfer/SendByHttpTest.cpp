@@ -1,4 +1,4 @@
-#include "platform/PocoInternet.h"
+#include "platform/line/PocoInternet.h"
 #include "support/LabServers.h"
 #include "support/TcpRelay.h"
 #include "support/UploadFormRig.h"

@@ -1,5 +1,5 @@
 #include "common/AnsiCodePage.h"
-#include "platform/PocoInternet.h"
+#include "platform/line/PocoInternet.h"
 #include "support/FtpFrmRig.h"
 #include "support/LabServers.h"
 #include "support/TcpRelay.h"

@@ -1,0 +1,232 @@
+#include "assembly/edited/B3.h"
+
+#include "assembly/OrderSheet.h"
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "editing/editor/gdisave.h"
+#include "imaging/files/BmpFile.h"
+#include "imaging/files/PictureFile.h"
+#include "order/EditRecord.h"
+#include "order/OrderLog.h"
+#include "order/PrintFileName.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <algorithm>
+#include <vector>
+
+namespace lumora {
+namespace {
+
+constexpr int shownForAWhile = 2000; // milliseconds
+constexpr int previewWidth = 300;
+
+OrderItem split(const QString& item) {
+    return OrderItem::split(item, OrderItem::Form::Edited);
+}
+
+} // namespace
+
+B3::B3(SessionState& state, const Platform& platform, PageChain& chain)
+    : PreparationPage(PageId::B3, state, platform, chain)
+    , Timer2(shownForAWhile, [this] { Timer2_Tick(); }) {}
+
+B3::~B3() = default;
+
+void B3::load() {
+    takeLines();
+    fillList2();
+    m_paper = PaperDigits::ofPaper(m_state.shemot.ppr);
+    m_jobFolder = WorkspacePaths::jobFolder(m_state);
+    Command1.visible = false;
+    Picture5.visible = false;
+    setStage(Stage::Waiting);
+    Timer2.start();
+}
+
+void B3::setTexts() {
+    const SessionState& s = m_state;
+    Label4Title.text = s.wording(u"הכנת תמונות למשלוח", u"Preparing your pictures");
+    Label1.text = doNotDelete(m_state);
+    Label2.text = untilPrinted(m_state);
+    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
+    Command5.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
+    // The same button in the two languages of the page.
+    Command2.text = QStringLiteral(" Stop All and EXIT");
+    Command2.visible = m_state.english();
+    Command7.text = s.wording(u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program");
+    Command7.visible = !m_state.english();
+    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
+    showProgress();
+    Q_EMIT changed();
+}
+
+void B3::Timer2_Tick() {
+    Timer2.stop();
+    Command5_Click();
+}
+
+void B3::Command5_Click() {
+    if (preparing || handedOver())
+        return;
+    Timer2.stop();
+    setPreparing(true);
+    const bool made = yield() && prepareOrder();
+    if (m_chain.hasEnded())
+        return;
+    setPreparing(false);
+    setStage(made ? Stage::Done : Stage::Waiting);
+    if (!made)
+        return;
+    if (m_state.TachanaMekomit)
+        handOver({});
+    else
+        handOver(m_state.transfer.SugSheliach == 1 ? PageId::UploadForm : PageId::FtpFrm);
+}
+
+void B3::Command2_Click() {
+    Command7_Click();
+}
+
+void B3::Command7_Click() {
+    Timer2.stop();
+    m_chain.endProgram();
+    m_chain.unload(PageId::B3);
+}
+
+bool B3::prepareOrder() {
+    List4fail.clear();
+    m_writeFailures = 0;
+    // Without the folder the sheet has no pictures, and that is all: the order goes on.
+    for (const QString& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
+        if (!m_platform.files.folderExists(path))
+            static_cast<void>(m_platform.files.makeFolder(path));
+    }
+    if (!somethingChosen())
+        return false;
+    m_state.transfer.MailFlag = 0;
+    CountTotalPics();
+    claimOrderNumber(m_state, m_platform.files, OrderFolder::Ending::Plain);
+    const OrderFolder folder(m_state, OrderFolder::Ending::Plain);
+    if (!openFolder(folder))
+        return false;
+
+    fillList2();
+    List1.setCurrentIndex(0);
+    PrintPacker packer(m_state, m_platform.files, folder, OrderTail::shortWidth);
+    {
+        EditedPrints prints(m_state, m_platform.files, List1.items(), m_paper);
+        if (!forEachPicture([&](int i) { PrepareOnePicture(i, packer, prints); }))
+            return false;
+    }
+
+    setStage(Stage::Closing);
+    countOrder();
+    if (!BuildOrderSheet())
+        return false;
+    setStage(Stage::Closing);
+    return writeLog(folder, editedOrderLog(m_state, List1.items(), List4fail.items(), m_platform.clock.now()));
+}
+
+void B3::fillList2() {
+    List2.clear();
+    for (const QString& item : List1.items())
+        List2.append(LeafName(item));
+}
+
+void B3::PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints) {
+    List2.setCurrentIndex(index);
+    const OrderItem item = split(List1.item(index));
+    packer.beginStep();
+    if (!item.hasUsableName())
+        return;
+    Label4Picture.text = LeafName(item.path);
+    Q_EMIT changed();
+    if (pack(packer, {index, item.code, item.path}, [&] { return RenderEditedPicture(item, prints); }))
+        saveThumbnail(item, packer.scratch());
+    packer.removeScratch();
+}
+
+Result<QByteArray> B3::RenderEditedPicture(const OrderItem& item, EditedPrints& prints) {
+    EditedPrintResult made = prints.next([this] { m_platform.pump.pump(); });
+    if (made.toneCopy) {
+        if (const Result<void> kept = keepToneCopy(item, *made.toneCopy); !kept) {
+            tellWriteFailure(kept.failure());
+            return kept.failure();
+        }
+    }
+    return made.jpeg;
+}
+
+// The copy of a corrected picture is looked for among the red-eye copies too, under the name of the copy itself.
+Result<void> B3::keepToneCopy(const OrderItem& item, NewContent& copy) {
+    EditFields edit;
+    UnpackEditState(item.record, edit);
+    if (Result<void> kept = copy.commit(NewContent::Durability::Passing); !kept)
+        return kept;
+    if (edit.RedMarker != EditRecord::corrected)
+        return {};
+    const QString path = WorkspacePaths::toneCopy(m_state);
+    return m_platform.files.copyFile(path, WorkspacePaths::corrected(m_state, path));
+}
+
+// Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
+void B3::saveThumbnail(const OrderItem& item, const QString& scratch) {
+    const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
+    const QString path =
+        m_jobFolder + u'\\' + item.code.left(2) + u'~' + PrintBaseName(item.path) + QStringLiteral(".bmp");
+    const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
+    const Result<PictureSize> size = source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch};
+    if (!size || !target)
+        return;
+    const auto height = static_cast<int>(RoundHalfEven(static_cast<double>(previewWidth) * size->height / size->width));
+    const Result<Bitmap> preview = loadPictureScaled(*source, {previewWidth, std::max(1, height)});
+    if (!preview)
+        return;
+    Picture3 = *preview;
+    Q_EMIT changed();
+    NewContent thumbnail(*target, path);
+    appendBmp(Picture3, thumbnail, [] { return false; });
+    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
+}
+
+bool B3::BuildOrderSheet() {
+    CountTotalPics();
+    List1.setCurrentIndex(0);
+    OrderSheet sheet(SheetKind::Edited, orderSheetSize(SheetKind::Edited, List1.count()),
+                     orderSheetBackground(SheetKind::Edited, m_state));
+    sheet.drawLines(editedSheetLines(m_state, m_platform.clock.now()));
+    std::vector<SheetCell> cells;
+    FileList File1(m_platform.files, QStringLiteral("*.bmp"));
+    File1.setFolder(m_jobFolder);
+    for (const QString& name : File1.names()) {
+        // Twice the last four characters: of the ending and of the name itself.
+        const QString caption = name.left(std::max<qsizetype>(0, name.size() - 8));
+        cells.push_back({m_platform.files.drives().toHost(m_jobFolder + u'\\' + name), caption});
+    }
+    setStage(Stage::Sheet);
+    sheet.drawContactSheet(cells, [&](int i) {
+        setStage(Stage::Sheet, i + 1);
+        return yield();
+    });
+    if (m_chain.hasEnded())
+        return false;
+    Picture5Image = sheet.bitmap();
+    Picture5.visible = true;
+    auto& save = static_cast<gdisave&>(m_chain.load(PageId::gdisave));
+    save.PicPic = Picture5Image;
+    save.Command6_Click();
+    return true;
+}
+
+void B3::setPreparing(bool on) {
+    Command5.enabled = !on;
+    Command5.visible = !on;
+    PreparationPage::setPreparing(on);
+}
+
+} // namespace lumora

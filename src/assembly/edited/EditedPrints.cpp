@@ -1,0 +1,68 @@
+#include "assembly/edited/EditedPrints.h"
+
+#include "common/FixedText.h"
+#include "editing/render/EditedPicture.h"
+#include "imaging/files/BmpFile.h"
+#include "order/EditRecord.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <new>
+#include <utility>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::path& toneCopy) try {
+    if (edit.ToneFlag != 1)
+        return {renderEditedPrintToJpeg(print, edit)};
+    Result<Bitmap> grey = loadGrey(print.file);
+    if (!grey)
+        return {grey.failure()};
+    print.grey = std::move(*grey);
+    auto copy = std::make_unique<NewContent>(toneCopy, toText(toneCopy));
+    appendBmp(print.grey, *copy, [] { return false; });
+    if (copy->failed())
+        return {Failure{Failure::Kind::Other, toText(toneCopy)}, std::move(copy)};
+    return {renderEditedPrintToJpeg(print, edit), std::move(copy)};
+} catch (const std::bad_alloc&) {
+    return {Failure{Failure::Kind::TooLarge, QStringLiteral("%1: memory is short").arg(toText(print.file))}};
+}
+
+} // namespace
+
+EditedPrints::EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
+                           std::optional<PaperDigits> paper)
+    : m_state(state)
+    , m_files(files)
+    , m_paper(paper) {
+    for (const QString& text : items) {
+        OrderItem item = OrderItem::split(text, OrderItem::Form::Edited);
+        if (item.hasUsableName())
+            m_items.push_back(std::move(item));
+    }
+    m_ahead = std::make_unique<Ahead>(static_cast<int>(m_items.size()),
+                                      [this](int i) { return rendering(m_items[static_cast<std::size_t>(i)]); });
+}
+
+EditedPrints::Ahead::Work EditedPrints::rendering(const OrderItem& item) const {
+    EditFields edit;
+    UnpackEditState(item.record, edit);
+    const Drives& drives = m_files.drives();
+    const QString source =
+        edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(m_state, item.path) : item.path;
+    const std::optional<HostPath> file = HasQuestionMark(source) ? std::nullopt : drives.toHost(source);
+    const std::optional<HostPath> copy = drives.toHost(WorkspacePaths::toneCopy(m_state));
+    if (!m_paper || !file || !copy)
+        return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source}}; };
+    EditedPrint print;
+    print.file = *file;
+    print.paper = *m_paper;
+    print.framesFolder = drives.toHost(WorkspacePaths::misgarot(m_state)).value_or(HostPath());
+    return [print, edit, copy = *copy] { return render(print, edit, copy); };
+}
+
+} // namespace lumora

@@ -1,0 +1,56 @@
+#pragma once
+
+#include "assembly/WorkAhead.h"
+#include "common/HostFile.h"
+#include "common/Result.h"
+#include "editing/render/PicturePlacement.h"
+#include "order/OrderItem.h"
+
+#include <QByteArray>
+#include <QStringList>
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace lumora {
+
+class Files;
+struct SessionState;
+
+// What the renderer makes of one line of an edited order.
+struct EditedPrintResult {
+    Result<QByteArray> jpeg;
+    // With a tone: the whole picture in grey, of which the print was made. It becomes bw.bmp when its step commits it;
+    // no print is made from that file, so that no picture is ever printed from another one's copy.
+    std::unique_ptr<NewContent> toneCopy = {};
+};
+
+// The prints of an edited order, rendered ahead of the steps that pack them, one for each line with a usable name. Only
+// values go into that work. A line that is marked "RED" is rendered from the corrected copy, and when that has vanished
+// it is a failure: the uncorrected picture is not what the customer saw.
+class EditedPrints {
+public:
+    // items as List1 holds them. Without a paper every print is a failure.
+    EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
+                 std::optional<PaperDigits> paper);
+
+    // The next print in the order of the list; calls whileWaiting again and again until it is there.
+    template <class Waiting>
+    EditedPrintResult next(Waiting whileWaiting) {
+        return m_ahead->take(whileWaiting);
+    }
+
+private:
+    using Ahead = WorkAhead<EditedPrintResult>;
+
+    Ahead::Work rendering(const OrderItem& item) const;
+
+    const SessionState& m_state;
+    const Files& m_files;
+    const std::optional<PaperDigits> m_paper;
+    std::vector<OrderItem> m_items;
+    std::unique_ptr<Ahead> m_ahead; // last, so that it ends first
+};
+
+} // namespace lumora

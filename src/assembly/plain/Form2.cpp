@@ -1,0 +1,310 @@
+#include "assembly/plain/Form2.h"
+
+#include "assembly/PaperResize.h"
+#include "assembly/WorkAhead.h"
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "order/OrderFolder.h"
+#include "order/OrderItem.h"
+#include "order/OrderLog.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+#include <QTimer>
+
+#include <vector>
+
+namespace lumora {
+namespace {
+
+OrderItem split(const QString& item) {
+    return OrderItem::split(item, OrderItem::Form::Plain);
+}
+
+// Either spelling of the camera and no other: what else there is was picked with a whole folder.
+bool isJpegItem(const QString& item) {
+    const QString ending = item.right(3);
+    return ending == QLatin1String("JPG") || ending == QLatin1String("jpg");
+}
+
+} // namespace
+
+// The prints of the order, scaled ahead of the step that packs them; only a source path goes into that work and only
+// bytes come out.
+class Form2::Prints {
+public:
+    Prints(const SessionState& state, const Files& files, const QStringList& items)
+        : m_files(files)
+        , m_paper(PaperDigits::ofPaper(state.shemot.ppr))
+        , m_sources(state.DchisaAmoka == 1 ? QStringList() : sourcesToScale(items))
+        , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
+
+    // The print of the next picture that is to be scaled.
+    template <class Waiting>
+    Result<QByteArray> next(Waiting whileWaiting) {
+        return m_prints.take(whileWaiting);
+    }
+
+private:
+    using Ahead = WorkAhead<Result<QByteArray>>;
+
+    static QStringList sourcesToScale(const QStringList& items) {
+        QStringList sources;
+        for (const QString& item : items) {
+            const OrderItem picture = split(item);
+            if (picture.hasUsableName() && !HasQuestionMark(item))
+                sources += picture.path;
+        }
+        return sources;
+    }
+
+    Ahead::Work scaling(const QString& path) const {
+        const std::optional<HostPath> source = m_files.drives().toHost(path);
+        return [source, paper = m_paper]() -> Result<QByteArray> {
+            if (!source || !paper)
+                return Failure{Failure::Kind::NotFound, {}};
+            return resizeToPaper(*source, *paper);
+        };
+    }
+
+    const Files& m_files;
+    const std::optional<PaperDigits> m_paper;
+    const QStringList m_sources;
+    Ahead m_prints;
+};
+
+Form2::Form2(SessionState& state, const Platform& platform, PageChain& chain)
+    : PreparationPage(PageId::Form2, state, platform, chain) {}
+
+Form2::~Form2() = default;
+
+void Form2::load() {
+    if (takeLines())
+        QTimer::singleShot(0, this, &Form2::Command3_Click);
+    Command6.visible = false;
+    Command4.visible = m_state.Optint == 10;
+    Picture5.visible = false;
+    Command5.visible = Command8.visible = false;
+    setStage(Stage::Waiting);
+}
+
+void Form2::setTexts() {
+    const SessionState& s = m_state;
+    Label1.text = s.wording(u"מארז תמונות", u"Preparing your pictures");
+    Label6.text = doNotDelete(m_state);
+    Label10.text = untilPrinted(m_state);
+    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
+    Command3.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
+    Command4.text = s.wording(u"הצג דף אלבום", u"Show the album sheet");
+    Command5.text = s.wording(u"צייר שוב את התמונות", u"Draw the pictures again");
+    Command6.text = s.wording(u"הכן את ההזמנה עכשיו", u"Prepare the order now");
+    Command7.text = s.wording(u"EXIT  יציאה", u"EXIT");
+    Command8.text = s.wording(u"החזר את הדף למקומו", u"Put the sheet back");
+    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
+    showProgress();
+    Q_EMIT changed();
+}
+
+void Form2::Command3_Click() {
+    if (preparing || handedOver())
+        return;
+    setPreparing(true);
+    setStage(Stage::Checking);
+    KeepOnlyJpeg();
+    const bool goOn = yield();
+    setPreparing(false);
+    if (goOn)
+        Command6_Click();
+}
+
+void Form2::Command6_Click() {
+    if (preparing || handedOver())
+        return;
+    List4fail.clear();
+    if (!somethingChosen())
+        return;
+    m_state.transfer.MailFlag = 0;
+    m_writeFailures = 0;
+    KeepOnlyJpeg();
+    if (!somethingChosen())
+        return;
+    List1.setCurrentIndex(0);
+
+    setPreparing(true);
+    const bool made = prepareOrder();
+    if (m_chain.hasEnded())
+        return;
+    setPreparing(false);
+    setStage(made ? Stage::Done : Stage::Waiting);
+    if (!made)
+        return;
+    if (m_state.TachanaMekomit) {
+        handOver({});
+        return;
+    }
+    const bool toFinishedOrders = m_state.TmunatPaar == 1 && m_state.Optint == 3;
+    if (toFinishedOrders && m_chain.isRegistered(PageId::MoogMeret))
+        m_state.handOver.lines = {m_state.transfer.OrderLogBase};
+    handOver(toFinishedOrders ? PageId::MoogMeret : PageId::FtpFrm);
+}
+
+void Form2::Command1_Click() {
+    if (preparing || List1.currentIndex() < 0)
+        return;
+    List1.removeAt(List1.currentIndex());
+    CountTotalPics();
+    Q_EMIT changed();
+}
+
+void Form2::Command7_Click() {
+    m_chain.endProgram();
+    m_chain.unload(PageId::Form2);
+}
+
+void Form2::Command4_Click() {
+    if (preparing)
+        return;
+    setPreparing(true);
+    CountTotalPics();
+    const bool goOn = drawSheet(SheetKind::Album);
+    setPreparing(false);
+    if (goOn)
+        setStage(Stage::Waiting);
+}
+
+void Form2::Command5_Click() {
+    if (preparing)
+        return;
+    setPreparing(true);
+    const bool goOn = drawSheet(sheetKind());
+    setPreparing(false);
+    if (goOn)
+        setStage(Stage::Waiting);
+}
+
+void Form2::Command8_Click() {
+    Picture5Position = {5, 5};
+    Q_EMIT changed();
+}
+
+void Form2::List1_Click(int index) {
+    if (preparing)
+        return;
+    List1.setCurrentIndex(index);
+    Q_EMIT changed();
+}
+
+void Form2::Picture5_MouseDown(QPoint at) {
+    m_dragFrom = at - Picture5Position;
+}
+
+void Form2::Picture5_MouseMove(QPoint at) {
+    if (!m_dragFrom)
+        return;
+    Picture5Position = at - *m_dragFrom;
+    Q_EMIT changed();
+}
+
+void Form2::Picture5_MouseUp() {
+    m_dragFrom.reset();
+}
+
+// The walk steps on after a removal, so that the item behind a removed one is not looked at until the next walk: the
+// lab knows the lists that come of it. Start walks twice.
+void Form2::KeepOnlyJpeg() {
+    for (int i = 0; i < List1.count(); ++i) {
+        if (isJpegItem(List1.item(i)))
+            continue;
+        List4removed.append(split(List1.item(i)).path);
+        List1.removeAt(i);
+    }
+    showProgress();
+    Q_EMIT changed();
+}
+
+bool Form2::prepareOrder() {
+    // Before the sheet is drawn: it shows the number.
+    claimOrderNumber(m_state, m_platform.files, OrderFolder::Ending::BySession);
+    CountTotalPics();
+    if (!drawSheet(sheetKind()))
+        return false;
+
+    const OrderFolder folder(m_state, OrderFolder::Ending::BySession);
+    if (!openFolder(folder))
+        return false;
+    const QString sheetPath = folder.sheetPath(QStringLiteral(".jpp"));
+    const Result<QByteArray> sheet = encodeJpeg(Picture5Image, printQuality);
+    const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
+    if (!saved)
+        tellWriteFailure(saved.failure());
+
+    PrintPacker packer(m_state, m_platform.files, folder, m_state.SugTzad);
+    Prints prints(m_state, m_platform.files, List1.items());
+    if (!forEachPicture([&](int i) { PackOnePicture(i, packer, prints); }))
+        return false;
+
+    setStage(Stage::Closing);
+    countOrder();
+    return writeLog(folder, plainOrderLog(m_state, List1.items(), List4fail.items(), m_platform.clock.now()));
+}
+
+void Form2::PackOnePicture(int index, PrintPacker& packer, Prints& prints) {
+    const OrderItem item = split(List1.item(index));
+    packer.beginStep();
+    if (!item.hasUsableName())
+        return;
+    // What the selection page leaves of a name that the code page can't carry.
+    if (HasQuestionMark(List1.item(index))) {
+        addFailed(item.path);
+        return;
+    }
+    Label4Picture.text = LeafName(item.path);
+    Q_EMIT changed();
+    pack(packer, {index, item.code, item.path}, [&] {
+        return m_state.DchisaAmoka == 1 ? m_platform.files.read(item.path)
+                                        : prints.next([this] { m_platform.pump.pump(); });
+    });
+}
+
+SheetKind Form2::sheetKind() const {
+    return m_state.Optint == 10 ? SheetKind::Album : SheetKind::Plain;
+}
+
+bool Form2::drawSheet(SheetKind kind) {
+    OrderSheet sheet(kind, orderSheetSize(kind, List1.count()), orderSheetBackground(kind, m_state));
+    const QDateTime now = m_platform.clock.now();
+    sheet.drawLines(kind == SheetKind::Album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now));
+    std::vector<SheetCell> cells;
+    for (const QString& item : List1.items())
+        cells.push_back({m_platform.files.drives().toHost(split(item).path),
+                         item.left(2) + u'_' + RightPart(NameWithoutEnding(item), 9)});
+    setStage(Stage::Sheet);
+    sheet.drawContactSheet(cells, [&](int i) {
+        setStage(Stage::Sheet, i + 1);
+        return yield();
+    });
+    Picture5Image = sheet.bitmap();
+    Picture5.visible = true;
+    Command5.visible = Command8.visible = true;
+    return !m_chain.hasEnded();
+}
+
+void Form2::setPreparing(bool on) {
+    for (Caption* button : {&Command1, &Command3, &Command4, &Command5, &Command6})
+        button->enabled = !on;
+    PreparationPage::setPreparing(on);
+}
+
+void Form2::showProgress() {
+    PreparationPage::showProgress();
+    Label4removed.visible = !List4removed.isEmpty();
+    Label4removed.text = m_state
+                             .wording(QStringLiteral("%1 קבצים שאינם תמונות jpg הוסרו מהרשימה:"),
+                                      QStringLiteral("Files that are no jpg pictures and were left out: %1"))
+                             .arg(List4removed.count());
+}
+
+} // namespace lumora

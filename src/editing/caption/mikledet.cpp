@@ -1,0 +1,332 @@
+#include "editing/caption/mikledet.h"
+
+#include "common/FixedText.h"
+#include "editing/editor/tFrmNew.h"
+#include "order/EditRecord.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int moveMilliseconds = 20;
+constexpr int sizeMilliseconds = 4;
+constexpr std::int16_t step = 2;
+constexpr int paletteField = 46; // pixels a side: a fingertip
+
+// Full colours that print as they look. The first after white is the one a new caption has.
+constexpr std::array<QRgb, 9> colours = {0xFFFFFFFF, 0xFFFFFF1E, 0xFFFF8C00, 0xFFDC1414, 0xFFFF4FA3,
+                                         0xFF7B2CBF, 0xFF1450D2, 0xFF148C28, 0xFF000000};
+
+Bitmap palette() {
+    QImage image(paletteField * static_cast<int>(colours.size()), paletteField, QImage::Format_RGB32);
+    for (int x = 0; x < image.width(); ++x) {
+        for (int y = 0; y < image.height(); ++y)
+            image.setPixel(x, y, colours[static_cast<std::size_t>(x / paletteField)]);
+    }
+    return Bitmap(image);
+}
+
+} // namespace
+
+mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& chain)
+    : Page(PageId::mikledet)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain)
+    , m_timer1(moveMilliseconds, [this] { Timer1_Tick(); })
+    , m_timer2(sizeMilliseconds, [this] { Timer2_Tick(); }) {
+    connect(&chain, &PageChain::shown, this, [this] {
+        stopHolding();
+        refresh(); // another picture may have been opened since
+    });
+}
+
+void mikledet::load() {
+    EditFields& edit = m_state.edit;
+    Picture18Image = palette();
+    Frame1.visible = false;
+    letters = m_state.english() ? KeyLayout::Letters::Small : KeyLayout::Letters::Hebrew;
+    if (edit.TextOn == 0) {
+        edit.TextFont = u"David"_s;
+        edit.TextFontSize = 14;
+        Text1.text.clear();
+    } else {
+        Text1.text = edit.TextBody;
+    }
+    Check4.checked = edit.TextOn != 0;
+}
+
+void mikledet::setTexts() {
+    const auto say = [this](const QString& hebrew, const QString& english) { return m_state.wording(hebrew, english); };
+    Title.text = say(u"מקלדת"_s, u"Keyboard"_s);
+    Command1.text = say(u"Space  רווח"_s, u"Space"_s);
+    Command4.text = u"ע"_s;
+    Command9.text = u"e"_s;
+    Command2.text = u"E"_s;
+    Command5.text = say(u"עוד"_s, u"More"_s);
+    Command7.text = u"Enter"_s;
+    Command6.text = say(u"נקה Clear"_s, u"Clear"_s);
+    Command8.text = say(u"הסר טקסט מתמונה הזו"_s, u"Remove this text"_s);
+    Command10.text = say(u"רשימת גופנים"_s, u"Font list"_s);
+    Command13.text = say(u"הודעות מוכנות"_s, u"Ready messages"_s);
+    Command14.text = say(u"מקלדת"_s, u"Keyboard"_s);
+    CommandDone.text = say(u"סיום"_s, u"Done"_s);
+    Check4.text = say(u"הצג טקסט"_s, u"Show text"_s);
+    Command3.hint = say(u"מחק את האות האחרונה"_s, u"Take back the last letter"_s);
+    Image1.hint = say(u"הגדל את האותיות"_s, u"Larger letters"_s);
+    Image2.hint = say(u"הקטן את האותיות"_s, u"Smaller letters"_s);
+    Image3.hint = say(u"רגיל, מודגש, נטוי"_s, u"Regular, bold, italic"_s);
+    Image4.hint = say(u"לרוחב או לאורך"_s, u"Across or down"_s);
+    Image15[0].hint = say(u"הזז שמאלה"_s, u"Move left"_s);
+    Image15[1].hint = say(u"הזז ימינה"_s, u"Move right"_s);
+    Image15[2].hint = say(u"הזז למעלה"_s, u"Move up"_s);
+    Image15[3].hint = say(u"הזז למטה"_s, u"Move down"_s);
+    Image5[0].hint = say(u"הטקסט מתחיל בנקודה"_s, u"The text begins at its point"_s);
+    Image5[1].hint = say(u"הטקסט ממורכז בנקודה"_s, u"The text is centred on its point"_s);
+    Image5[2].hint = say(u"הטקסט מסתיים בנקודה"_s, u"The text ends at its point"_s);
+    Picture18.hint = say(u"צבע הטקסט"_s, u"Colour of the text"_s);
+    relabel(letters);
+}
+
+void mikledet::relabel(KeyLayout::Letters to) {
+    letters = to;
+    for (int key = 0; key < KeyLayout::keys; ++key)
+        leter[static_cast<std::size_t>(key)].text = KeyLayout::caption(key, letters);
+    refresh();
+}
+
+void mikledet::refresh() {
+    Command4.checked = letters == KeyLayout::Letters::Hebrew;
+    Command9.checked = letters == KeyLayout::Letters::Small;
+    Command2.checked = letters == KeyLayout::Letters::Capital;
+    for (int alignment = 0; alignment < 3; ++alignment)
+        Image5[static_cast<std::size_t>(alignment)].checked = m_state.edit.TextAlign == alignment;
+    Q_EMIT changed();
+}
+
+void mikledet::Command4_Click() {
+    relabel(KeyLayout::Letters::Hebrew);
+}
+
+void mikledet::Command9_Click() {
+    relabel(KeyLayout::Letters::Small);
+}
+
+void mikledet::Command2_Click() {
+    relabel(KeyLayout::Letters::Capital);
+}
+
+void mikledet::Command5_Click() {
+    Frame1.visible = !Frame1.visible;
+    Q_EMIT changed();
+}
+
+void mikledet::leter_Click(int key) {
+    if (key >= 0 && key < KeyLayout::keys)
+        add(leter[static_cast<std::size_t>(key)].text);
+}
+
+void mikledet::KeyPress(QChar character) {
+    if (character == u' ') {
+        Command1_Click();
+    } else if (character == u'\r' || character == u'\n') {
+        Command7_Click();
+    } else if (character == u'\b') {
+        Command3_Click();
+    } else if (const auto text = KeyLayout::typed(character)) {
+        add(*text);
+    } else if (character.isPrint() || character.isHighSurrogate()) {
+        m_platform.dialogs.message(
+            m_state.wording(u"אי אפשר להדפיס את הסימן הזה"_s, u"This character can't be printed"_s));
+    }
+}
+
+void mikledet::add(const QString& text) {
+    if (Text1.text.size() >= mostLetters) {
+        m_platform.dialogs.message(m_state.wording(u"עד  60  אותיות"_s, u"Up to 60 letters"_s));
+        return;
+    }
+    Text1.text += text;
+    textChanged();
+    Frame1.visible = false;
+    Q_EMIT changed();
+}
+
+void mikledet::Command1_Click() {
+    Text1.text += u' ';
+    Q_EMIT changed();
+}
+
+void mikledet::Command3_Click() {
+    if (Text1.text.isEmpty())
+        return;
+    Text1.text.chop(1);
+    textChanged();
+}
+
+void mikledet::Command7_Click() {
+    Text1.text += u"\r\n"_s;
+    textChanged();
+}
+
+void mikledet::Command6_Click() {
+    Text1.text.clear();
+    textChanged();
+    Frame1.visible = false;
+    Q_EMIT changed();
+}
+
+void mikledet::Command8_Click() {
+    setTextOn(false);
+}
+
+void mikledet::Check4_Click(bool on) {
+    setTextOn(on);
+}
+
+void mikledet::setTextOn(bool on) {
+    Check4.checked = on;
+    m_state.edit.TextOn = on ? 1 : 0;
+    commitText();
+}
+
+void mikledet::Command10_Click() {
+    Combo1List.clear();
+    Combo1List.append(u"David"_s);
+    Combo1_Click(0);
+}
+
+void mikledet::Combo1_Click(int index) {
+    if (index < 0 || index >= Combo1List.count())
+        return;
+    Combo1List.setCurrentIndex(index);
+    Combo1.text = Combo1List.currentItem();
+    m_state.edit.TextFont = Combo1.text;
+    commitText();
+}
+
+void mikledet::CommandDone_Click() {
+    stopHolding();
+    Frame1.visible = false;
+    m_chain.show(PageId::tFrmNew);
+}
+
+void mikledet::Image1_MouseDown() {
+    holdSize(step);
+}
+
+void mikledet::Image2_MouseDown() {
+    holdSize(-step);
+}
+
+void mikledet::Image1_MouseUp() {
+    stopHolding();
+}
+
+void mikledet::Image2_MouseUp() {
+    stopHolding();
+}
+
+void mikledet::Image15_MouseDown(int direction) {
+    switch (direction) {
+    case 0:
+        return holdMove(-step, 0);
+    case 1:
+        return holdMove(step, 0);
+    case 2:
+        return holdMove(0, -step);
+    case 3:
+        return holdMove(0, step);
+    default:
+        return;
+    }
+}
+
+void mikledet::Image15_MouseUp() {
+    stopHolding();
+}
+
+void mikledet::holdSize(std::int16_t by) {
+    SizeStep = by;
+    m_held.press(m_timer2);
+}
+
+void mikledet::holdMove(std::int16_t x, std::int16_t y) {
+    MoveStepX = x;
+    MoveStepY = y;
+    m_held.press(m_timer1);
+}
+
+void mikledet::stopHolding() {
+    m_held.release();
+}
+
+void mikledet::tickOnceIfNone() {
+    m_held.tickOnceIfNone();
+}
+
+void mikledet::Timer1_Tick() {
+    if (!m_held.ticks(m_timer1))
+        return;
+    EditFields& edit = m_state.edit;
+    edit.TextX = HoldIn16Bits(edit.TextX + MoveStepX);
+    edit.TextY = HoldIn16Bits(edit.TextY + MoveStepY);
+    commitText();
+}
+
+void mikledet::Timer2_Tick() {
+    if (!m_held.ticks(m_timer2))
+        return;
+    m_state.edit.TextFontSize = HoldIn16Bits(m_state.edit.TextFontSize + SizeStep);
+    commitText();
+}
+
+void mikledet::Image3_Click() {
+    std::int16_t& style = m_state.edit.TextStyle;
+    style = style > 2 ? std::int16_t{0} : HoldIn16Bits(style + 1);
+    commitText();
+}
+
+void mikledet::Image4_Click() {
+    std::int16_t& vertical = m_state.edit.TextVertical;
+    vertical = vertical == EditRecord::runsDown ? std::int16_t{0} : EditRecord::runsDown;
+    commitText();
+}
+
+void mikledet::Image5_Click(int alignment) {
+    if (alignment < 0 || alignment > 2)
+        return;
+    m_state.edit.TextAlign = static_cast<std::int16_t>(alignment);
+    commitText();
+}
+
+void mikledet::Picture18_MouseDown(QPoint at) {
+    if (!Picture18Image.image().rect().contains(at))
+        return;
+    const QRgb pixel = Picture18Image.image().pixel(at);
+    EditFields& edit = m_state.edit;
+    edit.TextRed = static_cast<std::int16_t>(qRed(pixel));
+    edit.TextGreen = static_cast<std::int16_t>(qGreen(pixel));
+    edit.TextBlue = static_cast<std::int16_t>(qBlue(pixel));
+    commitText();
+}
+
+void mikledet::textChanged() {
+    m_state.edit.TextBody = Text1.text;
+    commitText();
+}
+
+void mikledet::commitText() {
+    static_cast<tFrmNew&>(m_chain.load(PageId::tFrmNew)).Command11_Click();
+    refresh();
+}
+
+} // namespace lumora

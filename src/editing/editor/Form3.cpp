@@ -1,0 +1,84 @@
+#include "editing/editor/Form3.h"
+
+#include "imaging/drawing/Drawing.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+namespace {
+
+constexpr int boxWidth = 700;
+constexpr int mostBoxHeight = 20'000;
+// Pixels of the picture for one of the box, for screens on which the page is shown larger.
+constexpr int fineness = 2;
+
+} // namespace
+
+Form3::Form3(const SessionState& state, const Platform& platform, PageChain& chain)
+    : Page(PageId::Form3)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain) {}
+
+void Form3::load() {
+    setTexts();
+}
+
+void Form3::setTexts() {
+    Command1.text = m_state.wording(QStringLiteral("סובב"), QStringLiteral("Turn"));
+    Command2.text = m_state.wording(QStringLiteral("הצג שוב"), QStringLiteral("Show again"));
+    Command3.text = m_state.wording(QStringLiteral("יציאה"), QStringLiteral("Exit"));
+    Q_EMIT changed();
+}
+
+void Form3::showPicture(const QString& path) {
+    Label1.text = path;
+    angle = 0;
+    Command2_Click();
+}
+
+void Form3::Command1_Click() {
+    angle += 90;
+    if (angle >= 360)
+        angle = 0;
+    Command2_Click();
+}
+
+void Form3::Command2_Click() {
+    Picture2 = {};
+    Picture2Box = {};
+    const auto read = [this]() -> Result<Bitmap> {
+        const std::optional<HostPath> file = m_platform.files.drives().toHost(Label1.text);
+        if (!file)
+            return Failure{Failure::Kind::NotFound, Label1.text};
+        const auto size = readPictureSize(*file);
+        if (!size)
+            return size.failure();
+        const double aspect = static_cast<double>(size->height) / size->width;
+        Picture2Box = {boxWidth, std::clamp(static_cast<int>(boxWidth * aspect), 1, mostBoxHeight)};
+        // A very tall picture gains nothing from being finer than its file.
+        const int times = Picture2Box.height > size->height ? 1 : fineness;
+        return loadPictureScaled(*file, {Picture2Box.width * times, Picture2Box.height * times});
+    };
+    const Result<Bitmap> picture = read();
+    if (picture) {
+        Picture2 = turned(*picture, static_cast<QuarterTurn>(angle));
+        if (angle == 90 || angle == 270)
+            std::swap(Picture2Box.width, Picture2Box.height);
+    } else {
+        Picture2Box = {};
+        m_platform.dialogs.message(picture.failure().message);
+    }
+    Q_EMIT changed();
+}
+
+void Form3::Command3_Click() {
+    m_chain.unload(PageId::Form3);
+}
+
+} // namespace lumora

@@ -1,0 +1,174 @@
+#include "editing/editor/gdisave.h"
+
+#include "imaging/files/PictureFile.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+namespace lumora {
+namespace {
+
+constexpr int genericError = 1;
+
+constexpr std::array<const char*, 21> statusTexts = {
+    "",
+    "Generic Error.",
+    "Invalid Parameter.",
+    "Out Of Memory.",
+    "Object Busy.",
+    "Insufficient Buffer.",
+    "Not Implemented.",
+    "Win32 Error.",
+    "Wrong State.",
+    "Aborted.",
+    "File Not Found.",
+    "Value Overflow.",
+    "Access Denied.",
+    "Unknown Image Format.",
+    "FontFamily Not Found.",
+    "FontStyle Not Found.",
+    "Not TrueType Font.",
+    "Unsupported Gdiplus Version.",
+    "Gdiplus Not Initialized.",
+    "Property Not Found.",
+    "Property Not Supported.",
+};
+
+// The number under which the drawing library would have reported the failure.
+int statusOf(Failure::Kind kind) {
+    switch (kind) {
+    case Failure::Kind::NotFound:
+        return 10;
+    case Failure::Kind::AccessDenied:
+        return 12;
+    case Failure::Kind::NoSpace:
+        return 7;
+    case Failure::Kind::Damaged:
+    case Failure::Kind::Unsupported:
+        return 13;
+    case Failure::Kind::TooLarge:
+        return 3;
+    default:
+        return genericError;
+    }
+}
+
+} // namespace
+
+gdisave::gdisave(SessionState& state, const Platform& platform, PageChain& chain, Starter start)
+    : Page(PageId::gdisave)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain)
+    , m_start(std::move(start)) {}
+
+void gdisave::load() {
+    GdiReady = false;
+    // The drawing of this system is always there; a start that fails is one that was handed in.
+    const int status = m_start ? m_start() : 0;
+    ShowGdiStatus(status);
+    if (status != 0)
+        m_platform.dialogs.message(QStringLiteral("GDI+ not inizialized."), QStringLiteral("GDI Error"));
+    GdiReady = status == 0;
+    HScroll1_Change(HScroll1);
+}
+
+void gdisave::setTexts() {
+    cmdSaveAsJpg.text = m_state.wording(QStringLiteral("שמור את התמונה"), QStringLiteral("Save the picture"));
+    Command1.text = m_state.wording(QStringLiteral("בטל"), QStringLiteral("Cancel"));
+    Command2.text = m_state.wording(QStringLiteral("שלח"), QStringLiteral("Send"));
+    Command5.text = QStringLiteral("Command5");
+    Command6.text = QStringLiteral("save info");
+    Command7.text = QStringLiteral("Command7_litlpic");
+    Label1.text = m_state.wording(QStringLiteral("איכות: "), QStringLiteral("Quality: ")) + QString::number(HScroll1);
+    Q_EMIT changed();
+}
+
+void gdisave::Command1_Click() {
+    m_chain.unload(PageId::gdisave);
+}
+
+void gdisave::Command5_Click() {
+    if (GdiReady)
+        SaveJpeg(PicPic, WorkspacePaths::scratchPicture(m_state), 80);
+}
+
+// An order may hold the sheet under both names: the HTTP sender and a local station take the plain picture.
+void gdisave::Command6_Click() {
+    if (!GdiReady)
+        return;
+    const QString sheet =
+        m_state.transfer.OrderFolder + QStringLiteral("\\!") + m_state.MisparHazmana + u'_' + m_state.shemot.ser;
+    if (m_state.transfer.SugSheliach == 0)
+        SaveJpeg(PicPic, sheet + QStringLiteral(".jpp"), 90);
+    if (m_state.transfer.SugSheliach == 1 || m_state.TachanaMekomit)
+        SaveJpeg(PicPic, sheet + QStringLiteral(".jpg"), 90);
+}
+
+void gdisave::Command7_Click() {
+    if (GdiReady)
+        SaveJpeg(LitlPic, WorkspacePaths::proofPicture(m_state), 70);
+}
+
+void gdisave::HScroll1_Change(int value) {
+    HScroll1 = std::clamp(value, HScroll1Min, HScroll1Max);
+    setTexts();
+}
+
+bool gdisave::SaveJpeg(const Bitmap& picture, const QString& path, int quality) {
+    if (picture.isNull()) {
+        ShowGdiStatus(2, path);
+        return false;
+    }
+    if (!FindEncoderClsid(QStringLiteral("image/jpeg"))) {
+        m_platform.dialogs.message(QStringLiteral("Konnte keinen passenden Encoder ermitteln."),
+                                   QStringLiteral("Encoder Error"));
+        return false;
+    }
+    const Result<QByteArray> jpeg = encodeJpeg(picture, std::clamp(quality, HScroll1Min, HScroll1Max));
+    const Result<void> saved = jpeg ? m_platform.files.writeWhole(path, *jpeg) : Result<void>(jpeg.failure());
+    if (!saved)
+        ShowGdiStatus(statusOf(saved.failure().kind), saved.failure().message);
+    return saved.ok();
+}
+
+int gdisave::ShowGdiStatus(int status, const QString& detail) {
+    if (status == 0)
+        return status;
+    QString text = GdiStatusText(status) + QStringLiteral(" GDI+ Error:") + QString::number(status);
+    if (!detail.isEmpty())
+        text += u'\n' + detail;
+    m_platform.dialogs.message(text, QStringLiteral("GDI Error"));
+    return status;
+}
+
+QString gdisave::GdiStatusText(int status) {
+    if (status < 1 || status >= static_cast<int>(statusTexts.size()))
+        return QStringLiteral("Unknown GDI+ Error.");
+    return QString::fromLatin1(statusTexts[static_cast<std::size_t>(status)]);
+}
+
+std::optional<gdisave::Encoder> gdisave::FindEncoderClsid(const QString& mimeType) {
+    if (mimeType.compare(QLatin1String("image/jpeg"), Qt::CaseInsensitive) == 0)
+        return Encoder::Jpeg;
+    return std::nullopt;
+}
+
+Bitmap gdisave::PictureFromFile(const QString& path) {
+    const std::optional<HostPath> host = m_platform.files.drives().toHost(path);
+    const Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path};
+    if (!picture) {
+        ShowGdiStatus(statusOf(picture.failure().kind), picture.failure().message);
+        return {};
+    }
+    return *picture;
+}
+
+} // namespace lumora

@@ -1,0 +1,400 @@
+#include "editing/editor/tFrmNew.h"
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "editing/editor/BigPics.h"
+#include "editing/render/EditedPicture.h"
+#include "order/EditRecord.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <QBuffer>
+#include <QPainter>
+
+#include <algorithm>
+
+namespace lumora {
+
+tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain)
+    : Page(PageId::tFrmNew)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain)
+    , m_frames(platform.files, WorkspacePaths::misgarot(state))
+    , Timer2(holdMilliseconds, [this] { Timer2_Tick(); })
+    , Timer3(holdMilliseconds, [this] { Timer3_Tick(); })
+    , Timer6(holdMilliseconds, [this] { Timer6_Tick(); })
+    , Timer7(holdMilliseconds, [this] { Timer7_Tick(); })
+    , Timer8(holdMilliseconds, [this] { Timer8_Tick(); }) {
+    // Whatever comes to the front, nobody holds a button of this page any more.
+    connect(&chain, &PageChain::shown, this, &tFrmNew::stopHolds);
+}
+
+tFrmNew::~tFrmNew() = default;
+
+void tFrmNew::load() {
+    // A size without two numbers, as that of an order of mixed sizes, leaves the usual paper.
+    const QString code = SizeCode(m_state.shemot.ppr);
+    if (PaperDigits::parse(code))
+        PaperSizeCode = code;
+    PicPicSize = previewBox(*PaperDigits::parse(PaperSizeCode), PaperOrientation::Landscape);
+
+    for (Caption* hidden : {&Frame3, &Frame4, &Labeltext, &Picture3, &Command10, &Command12, &Command23, &Command24})
+        hidden->visible = false;
+    for (Caption* operators : {&Frame5, &Label13})
+        operators->visible = m_state.DegelEdit;
+
+    Misgerett.checked = true;
+    for (const int style : {1, 2, 5, 6, 7, 8, 13, 14, 21, 22, 23, 24, 25, 26, 27, 28, 29})
+        Combo5List.append(QString::number(style));
+    // Without the folder there are no frames to offer, and nothing else is lost.
+    if (!m_platform.files.folderExists(WorkspacePaths::misgarot(m_state)))
+        static_cast<void>(m_platform.files.makeFolder(WorkspacePaths::misgarot(m_state)));
+    Combo4List.append(m_frames.categories());
+    if (!Combo4List.isEmpty()) {
+        edit().FrameFolder = Combo4List.item(0);
+        Combo4.text = Combo4List.item(0);
+        Combo4List.setCurrentIndex(0);
+    }
+    fillFrames(FrameLists::ListFile::Png);
+    PackEditState();
+    showNumbers();
+}
+
+EditFields& tFrmNew::edit() const {
+    return m_state.edit;
+}
+
+BigPics& tFrmNew::surfaces() const {
+    return static_cast<BigPics&>(m_chain.load(PageId::BigPics));
+}
+
+EditedPreview* tFrmNew::workPicture() const {
+    std::optional<EditedPreview>& work = surfaces().CipCip;
+    return work ? &*work : nullptr;
+}
+
+HostPath tFrmNew::hostOf(const QString& path) const {
+    return m_platform.files.drives().toHost(path).value_or(HostPath());
+}
+
+void tFrmNew::tell(const QString& hebrew, const QString& english, const QString& reason) const {
+    m_platform.dialogs.message(m_state.wording(hebrew, english) + u'\n' + reason);
+}
+
+void tFrmNew::hidePanels() {
+    if (!Frame3.visible && !Frame4.visible)
+        return;
+    Frame3.visible = false;
+    Frame4.visible = false;
+    Q_EMIT changed();
+}
+
+// --- opening ---
+
+void tFrmNew::Command17_Click() {
+    OpenPictureInEditor();
+    Q_EMIT changed();
+}
+
+void tFrmNew::OpenPictureInEditor() {
+    dropHold();
+    ++m_openings;
+    m_open = false;
+    m_frameKey.clear();
+    surfaces().CipCip.reset();
+    PicPic = Bitmap();
+    hidePanels();
+
+    ResetEditorZoom();
+    m_open = loadPictureOfRecord();
+    Title.text = m_open ? LeafName(edit().PicturePath) : QString();
+    Picture3.visible = m_open;
+    Image19.visible = !m_open;
+    PlaceTextLabel();
+    showNumbers();
+    if (!m_open)
+        return;
+    if (edit().AutoMarker == EditRecord::levelled)
+        surfaces().Command2_Click();
+    if (edit().ToneFlag == 1)
+        surfaces().Command1_Click();
+    workPicture()->placeAtCentreIfUnset(edit());
+    putHandle(QPointF(edit().PanX, edit().PanY));
+    packRenderStore();
+}
+
+void tFrmNew::ResetEditorZoom() {
+    PreviewZoom = edit().ZoomPercent;
+}
+
+bool tFrmNew::loadPictureOfRecord() {
+    if (edit().RedMarker != EditRecord::corrected)
+        return LoadWorkBitmap(edit().PicturePath);
+    edit().TempRedName = MangleFileName(edit().PicturePath);
+    const QString copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
+    if (m_platform.files.fileExists(copy))
+        return LoadWorkBitmap(copy);
+    // The picture without the correction, here and in the print, and never what lies under another name.
+    edit().RedMarker = EditRecord::notMarked;
+    if (!LoadWorkBitmap(edit().PicturePath))
+        return false;
+    tell(QStringLiteral("תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"),
+         QStringLiteral("The red-eye correction of this picture was lost. It is shown and printed without it"), copy);
+    return true;
+}
+
+bool tFrmNew::LoadWorkBitmap(const QString& path) {
+    const PaperDigits paper = *PaperDigits::parse(PaperSizeCode);
+    Result<EditedPreview> opened =
+        EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
+    if (!opened) {
+        tell(QStringLiteral("לא ניתן לפתוח את התמונה לעריכה"),
+             QStringLiteral("The picture can't be opened for editing"), opened.failure().message);
+        return false;
+    }
+    surfaces().CipCip = std::move(*opened);
+    PicPicSize = workPicture()->box();
+    writeWorkFile();
+    return true;
+}
+
+void tFrmNew::writeWorkFile() {
+    QByteArray bytes;
+    QBuffer buffer(&bytes);
+    buffer.open(QIODevice::WriteOnly);
+    workPicture()->workPicture().image().save(&buffer, "BMP");
+    const Result<void> written =
+        m_platform.files.writePassing(JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("0.bmp")), bytes);
+    // Editing goes on without that file; one word about it is enough.
+    if (!written && !m_workFileFailed)
+        m_platform.dialogs.message(written.failure().message);
+    m_workFileFailed = !written;
+}
+
+void tFrmNew::Command2_Click() {
+    stopHolds();
+    const QString picture = m_platform.dialogs.pickFile(
+        m_state.wording(QStringLiteral("לחץ על תמונה אחת פעמיים וכל התמונות מהתיקייה תוצגנה "),
+                        QStringLiteral("Double-click one picture and all the pictures of the folder will be shown")),
+        m_state.DiskRoot,
+        m_state.wording(QStringLiteral("בחר תמונה אחת וכל התמונות תוצגנה"),
+                        QStringLiteral("Choose one picture and all the pictures will be shown")));
+    if (picture.isEmpty())
+        return;
+    CommandDone_Click();
+    // The record of the picture that is left keeps its zoom and gains.
+    m_open = false;
+    edit().ZoomPercent = 100;
+    edit().GainR = edit().GainG = edit().GainB = 1;
+    ResetEditorZoom();
+    Q_EMIT picked(picture);
+}
+
+void tFrmNew::CommandDone_Click() {
+    stopHolds();
+    hidePanels();
+    if (m_chain.find(PageId::mikledet) != nullptr)
+        m_chain.unload(PageId::mikledet);
+    Q_EMIT left();
+    m_chain.show(PageId::kyoskNew);
+}
+
+// --- the record ---
+
+void tFrmNew::putHandle(QPointF position) {
+    constexpr double low = -32768;
+    constexpr double high = 32767;
+    Image3.put({std::clamp(position.x(), low, high), std::clamp(position.y(), low, high)});
+}
+
+void tFrmNew::handleToFields() {
+    edit().PanX = HoldIn16Bits(Image3.position().x());
+    edit().PanY = HoldIn16Bits(Image3.position().y());
+}
+
+void tFrmNew::PackEditState() {
+    // Before a picture is open the handle stands nowhere.
+    if (m_open)
+        handleToFields();
+    lumora::PackEditState(edit(), LeftField(m_state.shemot.Bord, 2), Combo4.text);
+    Label13.text = edit().EditState;
+}
+
+void tFrmNew::StoreCurrentEdit() {
+    Q_EMIT stored();
+}
+
+Bitmap tFrmNew::drawn(const EditFields& fields) {
+    return workPicture()->render(fields, frame(fields), m_scale);
+}
+
+Bitmap tFrmNew::takeSmallView() {
+    if (!m_open || !m_drawnSinceTaken)
+        return {};
+    m_drawnSinceTaken = false;
+    return workPicture()->render(edit(), frame(edit()));
+}
+
+void tFrmNew::RenderPreview() {
+    PicPic = drawn(edit());
+    m_drawnSinceTaken = true;
+    Q_EMIT changed();
+}
+
+void tFrmNew::packRenderStore() {
+    PackEditState();
+    RenderPreview();
+    StoreCurrentEdit();
+}
+
+void tFrmNew::renderPackStore() {
+    RenderPreview();
+    PackEditState();
+    StoreCurrentEdit();
+}
+
+void tFrmNew::Command5_Click() {
+    if (!m_open)
+        return;
+    PackEditState();
+    StoreCurrentEdit();
+    Q_EMIT changed();
+}
+
+void tFrmNew::UndoAllEdits() {
+    stopHolds();
+    const std::int16_t zoomBefore = PreviewZoom;
+    PreviewZoom = 100; // decides the size of the work picture
+    if (!loadPictureOfRecord()) {
+        PreviewZoom = zoomBefore;
+        return;
+    }
+    EditFields& fields = edit();
+    fields.ToneFlag = 0;
+    fields.GainR = fields.GainG = fields.GainB = 1;
+    fields.SpareFlag = 0;
+    fields.ZoomPercent = 100;
+    fields.RotationCode = 180;
+    // By the paper as it is now: it may be another one than before the reload.
+    putHandle(QPointF(PicPicSize.width / 2, PicPicSize.height / 2));
+    handleToFields();
+    renderPackStore();
+    showNumbers();
+}
+
+// --- looking ---
+
+void tFrmNew::showNumbers() {
+    Label10.text = QString::number(edit().RotationCode);
+    Label11.text = QString::number(PreviewZoom);
+}
+
+void tFrmNew::Command4_Click() {
+    if (!m_open)
+        return;
+    const Bitmap& work = workPicture()->workPicture();
+    const double z = std::max<int>(PreviewZoom, 1) / 100.0;
+    const double width = work.width();
+    const double height = work.height();
+    const QRectF source(2 * width / z - width, 2 * height / z - height, width / z, height / z);
+    QPainter painter(&PicPic.image());
+    painter.setRenderHint(QPainter::SmoothPixmapTransform);
+    painter.drawImage(QRectF(0, 0, PicPic.width(), PicPic.height()), work.image(), source);
+    painter.end();
+    Q_EMIT changed();
+}
+
+void tFrmNew::Command6_Click() {
+    if (!m_open)
+        return;
+    surfaces().Command2_Click();
+    edit().AutoMarker = EditRecord::levelled;
+    packRenderStore();
+}
+
+void tFrmNew::Command24_Click() {
+    PaperSizeCode = QStringLiteral("1014");
+}
+
+void tFrmNew::Command12_Click() {
+    PaperSizeCode = QStringLiteral("1015");
+}
+
+void tFrmNew::Command10_Click() {
+    PaperSizeCode = QStringLiteral("1318");
+}
+
+void tFrmNew::Command23_Click() {
+    PaperSizeCode = QStringLiteral("1521");
+}
+
+void tFrmNew::setPreviewScale(double scale) {
+    const double held = std::clamp(scale, 1.0, largestScale);
+    if (held == m_scale)
+        return;
+    m_scale = held;
+    if (m_open)
+        RenderPreview();
+}
+
+void tFrmNew::Image29_Click() {
+    hintsAsLabels = !hintsAsLabels;
+    setTexts();
+}
+
+void tFrmNew::Image13_MouseMove() {
+    Frame3.visible = true;
+    Frame4.visible = false;
+    Q_EMIT changed();
+}
+
+void tFrmNew::Image15_MouseMove() {
+    Frame4.visible = true;
+    Frame3.visible = false;
+    Q_EMIT changed();
+}
+
+// --- the crop markers ---
+
+void tFrmNew::Command14_Click() {
+    crop.toCorners(PicPicSize);
+    Q_EMIT changed();
+}
+
+void tFrmNew::Command13_Click() {
+    crop.toInset(PicPicSize);
+    Q_EMIT changed();
+}
+
+void tFrmNew::Command16_Click() {
+    crop.widen(CropFrame::step);
+    Q_EMIT changed();
+}
+
+void tFrmNew::Command15_Click() {
+    crop.widen(-CropFrame::step);
+    Q_EMIT changed();
+}
+
+void tFrmNew::CropHandle_MouseDown(CropFrame::Corner corner, QPointF at) {
+    m_cropCorner = corner;
+    m_cropHandle.press(at);
+}
+
+void tFrmNew::CropHandle_MouseMove(QPointF at) {
+    if (!m_cropHandle.held())
+        return;
+    crop.drag(m_cropCorner, m_cropHandle.distance(at));
+    Q_EMIT changed();
+}
+
+void tFrmNew::CropHandle_MouseUp() {
+    m_cropHandle.release();
+}
+
+} // namespace lumora

@@ -1,0 +1,316 @@
+#include "editing/render/EditedPicture.h"
+
+#include "imaging/Stopwatch.h"
+#include "imaging/drawing/ColourMatrix.h"
+#include "imaging/scaling/Resample.h"
+#include "order/EditRecord.h"
+#include "platform/files/HostPath.h"
+#include "session/SessionState.h"
+
+#include <QPainter>
+
+#include <algorithm>
+#include <cmath>
+
+namespace lumora {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr float crossGain = 1.0F / 1000.0F;
+constexpr int printQuality = 90;
+
+ColourMatrix coloursOf(const EditFields& edit) {
+    return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
+}
+
+// As the record carries it, so that the editor shows no more than what prints.
+PictureCaption captionOf(const EditFields& edit) {
+    namespace R = EditRecord;
+    const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
+    PictureCaption caption;
+    caption.text = R::stored(R::TextBody, edit.TextBody);
+    caption.family = edit.TextFont;
+    caption.emSize = R::stored(R::TextFontSize, edit.TextFontSize);
+    caption.bold = (edit.TextStyle & 1) != 0;
+    caption.italic = (edit.TextStyle & 2) != 0;
+    caption.align = edit.TextAlign == R::alignCentre ? PictureCaption::Align::Centre
+                    : edit.TextAlign == R::alignFar  ? PictureCaption::Align::Far
+                                                     : PictureCaption::Align::Near;
+    caption.run = edit.TextVertical == R::runsDown ? PictureCaption::Run::Down : PictureCaption::Run::Across;
+    caption.colour = QColor(channel(edit.TextRed), channel(edit.TextGreen), channel(edit.TextBlue));
+    caption.x = R::stored(R::TextX, edit.TextX);
+    caption.y = R::stored(R::TextY, edit.TextY);
+    return caption;
+}
+
+// What lies over the picture, in preview and print alike. What is empty is left out.
+void drawOver(Bitmap& paper, const KeyedFrame& frame, const CaptionInk& ink) {
+    drawKeyedFrame(paper, frame);
+    drawInk(paper, ink);
+}
+
+// A part of the picture's own pixels, which have to outlive it.
+Bitmap within(const Bitmap& picture, const QRect& part) {
+    const QImage& image = picture.image();
+    const QRect area = part & image.rect();
+    return Bitmap(QImage(image.constScanLine(area.top()) + std::ptrdiff_t{area.left()} * 4, area.width(), area.height(),
+                         image.bytesPerLine(), image.format()));
+}
+
+PictureSize scaledSize(PictureSize size, double scale) {
+    const auto side = [scale](int pixels) { return std::max(1, static_cast<int>(std::lround(pixels * scale))); };
+    return {side(size.width), side(size.height)};
+}
+
+bool touches(const Placement& placement, PictureSize paper) {
+    const PictureSize size = placement.zoomed();
+    double left = 1e9;
+    double top = 1e9;
+    double right = -1e9;
+    double bottom = -1e9;
+    for (const int x : {0, size.width}) {
+        for (const int y : {0, size.height}) {
+            const Placement::Point corner = placement.onPaper(x, y);
+            left = std::min(left, corner.x);
+            right = std::max(right, corner.x);
+            top = std::min(top, corner.y);
+            bottom = std::max(bottom, corner.y);
+        }
+    }
+    return right > -1 && bottom > -1 && left < paper.width + 1 && top < paper.height + 1;
+}
+
+// One name and no way out of the folder it is looked up in.
+bool isPlainName(const QString& name) {
+    return !name.contains(u'/') && !name.contains(u'\\') && !name.contains(u':') &&
+           !name.contains(QStringLiteral("..")) && !name.contains(QChar(0)) && name != QStringLiteral(".");
+}
+
+// The labs that make frames see no difference between "k011.bmp" and "K011.BMP".
+fs::path fileNamed(const fs::path& folder, const QString& leaf) {
+    const fs::path exact = folder / toHostPath(leaf);
+    std::error_code error;
+    if (fs::exists(exact, error))
+        return exact;
+    for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
+        if (toText(at->path().filename()).compare(leaf, Qt::CaseInsensitive) == 0)
+            return at->path();
+    }
+    return exact;
+}
+
+// The work picture: shrunk by the averaging cubic, enlarged by a straight line between pixels, as the lab's own editor
+// does when it loads a picture smaller than that.
+Result<Bitmap> loadWork(const fs::path& file, PictureSize fileSize, PictureSize wanted) {
+    if (wanted.width <= fileSize.width && wanted.height <= fileSize.height)
+        return loadPictureScaled(file, wanted);
+    auto small = loadPicture(file);
+    if (!small)
+        return small;
+    Bitmap enlarged(wanted.width, wanted.height, Qt::white);
+    if (!enlarged.isNull()) {
+        QPainter painter(&enlarged.image());
+        painter.setRenderHint(QPainter::SmoothPixmapTransform);
+        painter.drawImage(QRect(0, 0, wanted.width, wanted.height), small->image());
+    }
+    return enlarged;
+}
+
+Failure noRoom(const fs::path& file, PictureSize size) {
+    return {
+        Failure::Kind::TooLarge,
+        QStringLiteral("%1: no memory for a picture of %2 x %3").arg(toText(file)).arg(size.width).arg(size.height)};
+}
+
+Result<Bitmap> loadGreyPart(const EditedPrint& print, PictureSize wanted, const QRect& part) {
+    Result<Bitmap> whole = print.grey.isNull() ? loadGrey(print.file) : Result<Bitmap>(print.grey);
+    if (!whole)
+        return whole;
+    Bitmap scaled = resampledPart(*whole, wanted, part);
+    if (scaled.isNull())
+        return noRoom(print.file, wanted);
+    return scaled;
+}
+
+} // namespace
+
+std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& edit, FrameUse use) {
+    const QString name = edit.FrameName.trimmed();
+    const QString folder = edit.FrameFolder.trimmed();
+    if (framesFolder.empty() || name.isEmpty() || name == EditRecord::noFrame || name == EditRecord::frameRemoved ||
+        !isPlainName(name) || !isPlainName(folder))
+        return std::nullopt;
+    const auto load = [&](const QString& leaf) -> std::optional<Bitmap> {
+        auto frame = loadPicture(fileNamed(framesFolder / toHostPath(folder), leaf + QStringLiteral(".bmp")));
+        return frame ? std::optional(*frame) : std::nullopt;
+    };
+    if (use == FrameUse::Print) {
+        if (auto frame = load(name))
+            return frame;
+    }
+    return load(u'k' + name);
+}
+
+Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits paper, int zoomPercent, Tone tone,
+                                          double largestScale) {
+    const auto size = readPictureSize(file);
+    if (!size)
+        return size.failure();
+    const auto workSize = workPictureSize(*size, zoomPercent);
+    if (!workSize)
+        return Failure{Failure::Kind::TooLarge, QStringLiteral("%1: a picture of %2 x %3 is too slim to be edited")
+                                                    .arg(toText(file))
+                                                    .arg(size->width)
+                                                    .arg(size->height)};
+    const PictureSize most = scaledSize(*workSize, largestScale);
+    const PictureSize sharp{std::clamp(most.width, workSize->width, std::max(workSize->width, size->width)),
+                            std::clamp(most.height, workSize->height, std::max(workSize->height, size->height))};
+    const auto loaded = loadWork(file, *size, sharp);
+    if (!loaded)
+        return loaded.failure();
+    EditedPreview preview;
+    preview.m_box = previewBox(paper, orientationOf(*size));
+    preview.m_work = onWhite(*loaded);
+    if (sharp != *workSize) {
+        preview.m_sharp = preview.m_work;
+        preview.m_work = resampled(preview.m_sharp, *workSize);
+    }
+    if (preview.m_work.isNull())
+        return noRoom(file, *workSize);
+    if (tone == Tone::Grey)
+        preview.turnGrey();
+    return preview;
+}
+
+void EditedPreview::turnGrey() {
+    const ColourMatrix grey = ColourMatrix::grey(greyWeight);
+    m_work = grey.applied(m_work);
+    if (!m_sharp.isNull())
+        m_sharp = grey.applied(m_sharp);
+    m_overlay = {};
+}
+
+void EditedPreview::placeAtCentreIfUnset(EditFields& edit) const {
+    constexpr int unset = 781;
+    if (edit.PanX < unset && edit.PanY < unset)
+        return;
+    edit.PanX = static_cast<std::int16_t>(m_box.width / 2);
+    edit.PanY = static_cast<std::int16_t>(m_box.height / 2);
+}
+
+void EditedPreview::setBackground(QColor colour) {
+    m_colour = colour;
+    m_overlay = {};
+}
+
+void EditedPreview::prepareOverlay(const EditFields& edit, const std::optional<Bitmap>& frame, double scale) {
+    const PictureSize size = scaledSize(m_box, scale);
+    if (m_overlay.scale != scale) {
+        m_overlay = {};
+        m_overlay.scale = scale;
+    }
+    if (!frame) {
+        m_overlay.frame = {};
+        m_overlay.frameKey = 0;
+    } else if (m_overlay.frameKey != frame->image().cacheKey()) {
+        m_overlay.frame = keyedFrame(*frame, size);
+        m_overlay.frameKey = frame->image().cacheKey();
+    }
+    m_overlay.ink = edit.TextOn == 1 ? m_overlay.inks.inkOf(captionOf(edit), size, {scale, scale}) : CaptionInk();
+}
+
+Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale) {
+    prepareOverlay(edit, frame, scale);
+    Placement placement = previewPlacement({m_work.width(), m_work.height()}, m_box, edit);
+    placement.drawWidth *= scale;
+    placement.drawHeight *= scale;
+    placement.panX *= scale;
+    placement.panY *= scale;
+    const PictureSize size = scaledSize(m_box, scale);
+    const bool uncovered = !placement.covers(size);
+    if (uncovered && m_overlay.background.isNull())
+        m_overlay.background =
+            m_colour ? Bitmap(size.width, size.height, *m_colour) : resampled(sourceFor(scale), size);
+    // The stretched picture takes longer than all the rest; as long as nothing of it shows it is not made.
+    Bitmap paper = uncovered ? m_overlay.background : Bitmap(size.width, size.height, Qt::white);
+    drawPlaced(paper, sourceFor(scale), placement, coloursOf(edit));
+    drawOver(paper, m_overlay.frame, m_overlay.ink);
+    return paper;
+}
+
+Result<Bitmap> loadGrey(const fs::path& file) {
+    auto picture = loadPicture(file);
+    if (!picture)
+        return picture;
+    const PictureSize size{picture->width(), picture->height()};
+    if (picture->image().format() != QImage::Format_RGB32)
+        *picture = onWhite(*picture);
+    if (picture->isNull())
+        return noRoom(file, size);
+    ColourMatrix::grey(greyWeight).apply(*picture);
+    return picture;
+}
+
+Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
+    Stopwatch watch(times);
+    const auto size = readPictureSize(print.file);
+    if (!size)
+        return size.failure();
+    const PrintGeometry geometry = printGeometry(print.paper, orientationOf(*size));
+    const Placement placement = printPlacement(*size, geometry, edit);
+    const bool shows = touches(placement, geometry.size);
+    const bool stretched = !print.background && !(shows && placement.covers(geometry.size));
+
+    // One decode serves both: what the placed picture needs, and where it leaves paper uncovered, what the stretched
+    // one needs.
+    PictureSize wanted = shows ? reducedSize(*size, placement) : PictureSize{1, 1};
+    QRect part = shows ? neededPart(wanted, placement, geometry.size) : QRect(0, 0, 1, 1);
+    if (stretched) {
+        if (!shows)
+            wanted = geometry.size;
+        wanted = {std::max(wanted.width, std::min(size->width, geometry.size.width)),
+                  std::max(wanted.height, std::min(size->height, geometry.size.height))};
+        part |= QRect(0, 0, wanted.width, wanted.height);
+    }
+    auto loaded = edit.ToneFlag == 1 ? loadGreyPart(print, wanted, part) : loadPicturePart(print.file, wanted, part);
+    if (!loaded)
+        return loaded.failure();
+    watch.add(&PictureTimes::decode);
+
+    Bitmap& picture = *loaded;
+    if (picture.image().format() != QImage::Format_RGB32)
+        picture = onWhite(picture);
+    const Bitmap whole = within(picture, QRect(-part.topLeft(), QSize(wanted.width, wanted.height)));
+    Bitmap paper(geometry.size.width, geometry.size.height, print.background.value_or(Qt::white));
+    if (paper.isNull())
+        return noRoom(print.file, geometry.size);
+    if (stretched) {
+        for (const QRect& bare : placement.uncovered(geometry.size))
+            drawStretched(paper, whole, bare);
+    }
+    if (shows && wanted == reducedSize(*size, placement)) {
+        coloursOf(edit).apply(picture);
+        drawPlacedPart(paper, picture, part, wanted, placement);
+    } else if (shows) {
+        drawPlaced(paper, whole, placement, coloursOf(edit));
+    }
+    const auto frame = loadFrame(print.framesFolder, edit, FrameUse::Print);
+    drawOver(paper, frame ? keyedFrame(*frame, geometry.size) : KeyedFrame(),
+             edit.TextOn == 1 ? inkOf(captionOf(edit), geometry.size, {geometry.scaleX, geometry.scaleY})
+                              : CaptionInk());
+    watch.add(&PictureTimes::draw);
+    return paper;
+}
+
+Result<QByteArray> renderEditedPrintToJpeg(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
+    const auto paper = renderEditedPrint(print, edit, times);
+    if (!paper)
+        return paper.failure();
+    Stopwatch watch(times);
+    auto bytes = encodeJpeg(*paper, printQuality);
+    watch.add(&PictureTimes::encode);
+    return bytes;
+}
+
+} // namespace lumora

@@ -1,0 +1,57 @@
+#pragma once
+
+#include "imaging/drawing/PlacedDraw.h"
+#include "imaging/files/PictureFile.h"
+
+#include <QString>
+
+#include <optional>
+
+namespace lumora {
+
+struct EditFields;
+
+// How the numbers of an edit record become places on paper: the preview's box, the reduced work picture, the print, and
+// where the picture lands on each. The preview is the reference; the print repeats it with every pixel number
+// multiplied by the scale.
+
+enum class PaperOrientation { Landscape, Portrait };
+
+// A square picture counts as portrait.
+PaperOrientation orientationOf(PictureSize picture);
+
+// A paper in whole centimetres.
+struct PaperDigits {
+    int shortSide = 0;
+    int longSide = 0;
+    bool operator==(const PaperDigits&) const = default;
+
+    // From a four-digit paper code, "1015". No value for a text without two usable numbers, as "zz/zz" gives.
+    static std::optional<PaperDigits> parse(const QString& code);
+    // From a paper as the order names it, "10/15": its first two characters and its last two.
+    static std::optional<PaperDigits> ofPaper(const QString& paper);
+};
+
+// The box that stands for the paper: 450 wide in landscape, 300 wide in portrait. The two differ in size on purpose,
+// since positions in the record are in these pixels.
+PictureSize previewBox(PaperDigits paper, PaperOrientation orientation);
+
+// The work picture that all previews are drawn from: five times the zoom at which it was opened, at most 700, portrait
+// pictures three quarters of that. At least 1 pixel a side; no value for a picture so slim that a side would pass
+// 20,000.
+std::optional<PictureSize> workPictureSize(PictureSize picture, int zoomPercent);
+
+// Where the work picture lands in the preview's box. Sizes are cut to whole pixels at each step.
+Placement previewPlacement(PictureSize workPicture, PictureSize box, const EditFields& edit);
+
+// 100 pixels a centimetre.
+struct PrintGeometry {
+    PictureSize size;
+    double scaleX = 1;
+    double scaleY = 1;
+};
+PrintGeometry printGeometry(PaperDigits paper, PaperOrientation orientation);
+
+Placement printPlacement(PictureSize picture, const PrintGeometry& print, const EditFields& edit);
+
+} // namespace lumora

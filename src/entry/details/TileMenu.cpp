@@ -1,0 +1,52 @@
+#include "entry/details/TileMenu.h"
+
+#include <vector>
+
+namespace lumora {
+
+namespace {
+
+struct ClientTiles {
+    const char* letter;
+    std::vector<TileIndex> hidden;
+    std::vector<TileIndex> shown;
+};
+
+} // namespace
+
+std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar) {
+    static const std::vector<ClientTiles> clients = {
+        {"B", {QuickTile}, {}},
+        {"C", {QuickTile, NothingTile}, {}},
+        {"D", {QuickTile, NothingTile, MailTile}, {}},
+        {"CL", {QuickTile, NothingTile}, {AlbumTile}},
+        {"AL", {NothingTile}, {QuickTile, AlbumTile}},
+        {"AS", {NothingTile}, {QuickTile, OtherTile}},
+    };
+    std::array<bool, TileCount> visible;
+    visible.fill(true);
+    visible[AlbumTile] = visible[RestartTile] = visible[OtherTile] = false;
+    for (const ClientTiles& client : clients) {
+        if (clientLetter != QLatin1String(client.letter))
+            continue;
+        for (const TileIndex tile : client.hidden)
+            visible[tile] = false;
+        for (const TileIndex tile : client.shown)
+            visible[tile] = true;
+    }
+    if (tmunatPaar == 1)
+        visible[RestartTile] = true;
+    if (minuyPaar == 2)
+        visible[QuickTile] = false;
+    return visible;
+}
+
+QString borderCode(int index) {
+    static constexpr std::array<const char*, 10> codes = {"NB", "B7",  "BB1", "BB2", "CA1",
+                                                          "BB", "CA9", "BL1", "FA9", "WB"};
+    if (index < 0 || index >= static_cast<int>(codes.size()))
+        return {};
+    return QString::fromLatin1(codes[static_cast<std::size_t>(index)]);
+}
+
+} // namespace lumora

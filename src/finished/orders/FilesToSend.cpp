@@ -1,0 +1,92 @@
+#include "finished/orders/FilesToSend.h"
+
+#include "common/DrivePathText.h"
+#include "order/OrderDetailsReader.h"
+#include "order/OrderNames.h"
+#include "order/PieceName.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+void FilesToSend::setFolder(const QString& folder) {
+    m_folder = folder;
+    refresh();
+}
+
+void FilesToSend::setPattern(const QString& patterns) {
+    m_pattern = patterns;
+    refresh();
+}
+
+void FilesToSend::refresh() {
+    m_names.clear();
+    m_names.append(m_files.names(m_folder, m_pattern));
+    m_marked.assign(static_cast<std::size_t>(m_names.count()), false);
+}
+
+bool FilesToSend::isMarked(int index) const {
+    return index >= 0 && index < m_names.count() && m_marked[static_cast<std::size_t>(index)];
+}
+
+int FilesToSend::markedCount() const {
+    return static_cast<int>(std::count(m_marked.begin(), m_marked.end(), true));
+}
+
+void FilesToSend::turnMark(int index) {
+    m_names.setCurrentIndex(index);
+    if (m_names.currentIndex() >= 0)
+        m_marked[static_cast<std::size_t>(index)].flip();
+}
+
+void FilesToSend::markAll(std::int16_t Mefurak) {
+    for (int i = 0; i < m_names.count(); ++i)
+        m_marked[static_cast<std::size_t>(i)] = Mefurak <= 0 || IsPiece(m_names.item(i)) || IsSheet(m_names.item(i));
+}
+
+QStringList FilesToSend::markedNames() const {
+    QStringList names;
+    for (int i = 0; i < m_names.count(); ++i) {
+        if (isMarked(i))
+            names.append(m_names.item(i));
+    }
+    return names;
+}
+
+std::int16_t FilesToSend::familyCount() const {
+    return CopiesCount(markedNames());
+}
+
+QStringList FilesToSend::markedPaths() const {
+    QStringList paths = markedNames();
+    for (QString& path : paths)
+        path = JoinDrivePath(m_folder, path);
+    return paths;
+}
+
+std::optional<QString> FilesToSend::unmarkedSheet() const {
+    if (m_names.isEmpty() || isMarked(0) || !IsSheet(m_names.item(0)))
+        return std::nullopt;
+    return JoinDrivePath(m_folder, m_names.item(0));
+}
+
+QStringList FilesToSend::resendList() const {
+    const QString text = OrderTextPath(m_folder);
+    QStringList list = markedPaths();
+    // It may be among the marked files, and a name that stands twice in an order never arrives twice.
+    list.removeAll(text);
+    if (m_files.fileExists(text))
+        list.prepend(text);
+    if (const auto sheet = unmarkedSheet(); sheet && !list.isEmpty())
+        list.append(*sheet);
+    return list;
+}
+
+QStringList FilesToSend::mailList() const {
+    QStringList list = markedPaths();
+    if (const auto sheet = unmarkedSheet())
+        list.prepend(*sheet);
+    return list;
+}
+
+} // namespace lumora

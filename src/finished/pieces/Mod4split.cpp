@@ -1,0 +1,218 @@
+#include "finished/pieces/Mod4split.h"
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "common/HostFile.h"
+#include "order/PieceName.h"
+#include "platform/files/Files.h"
+
+#include <QSet>
+
+#include <algorithm>
+
+namespace lumora {
+
+namespace {
+
+const QString meforakim = QStringLiteral("meforakim");
+const QString moorkavim = QStringLiteral("moorkavim");
+
+Failure fault(Failure::Kind kind, const QString& path, const QString& reason) {
+    return {kind, QStringLiteral("%1: %2").arg(path, reason)};
+}
+
+} // namespace
+
+std::optional<std::int32_t> SegmentSize(const QString& text) {
+    bool isNumber = false;
+    const int size = text.trimmed().toInt(&isNumber);
+    if (!isNumber || size < 1)
+        return std::nullopt;
+    return size;
+}
+
+Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target target,
+                         const QString& extension) const {
+    Cut cut;
+    cut.passedOver = path.right(3) != extension;
+    if (cut.passedOver)
+        return cut;
+    const auto refuse = [&cut](Failure failure) {
+        cut.failure = std::move(failure);
+        return cut;
+    };
+    const auto segment = SegmentSize(segmentText);
+    if (!segment)
+        return refuse(
+            fault(Failure::Kind::Unsupported, segmentText, QStringLiteral("no number of bytes from 1 to 2147483647")));
+    const auto length = m_files.size(path);
+    if (!length)
+        return refuse(length.failure());
+    const qint64 declared = *length / *segment + 1;
+    // Joining finds a number by three digits: pieces with more could never be put together again.
+    if (declared > mostPieces)
+        return refuse(fault(Failure::Kind::TooLarge, path,
+                            QStringLiteral("%1 pieces of %2 bytes; names have room for %3")
+                                .arg(declared)
+                                .arg(*segment)
+                                .arg(mostPieces)));
+    cut.declared = static_cast<int>(declared);
+    const QString total = PieceNumber(cut.declared);
+    const QString stem = PieceStem(LeafName(path));
+    const QString longest = stem + PieceTail(1, total);
+    // A name that the drive would shorten loses the numbers at its end.
+    if (ShortenedName(longest) != longest)
+        return refuse(fault(Failure::Kind::Unsupported, path, QStringLiteral("the name is too long for pieces")));
+
+    const auto host = m_files.host(path);
+    if (!host)
+        return refuse(host.failure());
+    const auto source = openSource(*host, path);
+    if (!source)
+        return refuse(source.failure());
+    cut.folder = ParentFolder(path);
+    if (target == Target::Meforakim) {
+        cut.folder = JoinDrivePath(cut.folder, meforakim);
+        if (const auto made = m_files.makeFolder(cut.folder); !made)
+            return refuse(made.failure());
+    }
+    for (qint64 offset = 0; offset < *length; offset += *segment) {
+        if (!m_step(cut.pieces, cut.declared)) {
+            cut.stopped = true;
+            return cut;
+        }
+        const QString piece = JoinDrivePath(cut.folder, stem + PieceTail(cut.pieces + 1, total));
+        const auto written = writePiece(piece, *source, std::min<qint64>(*segment, *length - offset), path);
+        if (!written)
+            return refuse(written.failure());
+        ++cut.pieces;
+    }
+    return cut;
+}
+
+Result<void> Mod4split::writePiece(const QString& path, const Descriptor& source, qint64 count,
+                                   const QString& sourcePath) const {
+    const auto host = m_files.host(path);
+    if (!host)
+        return host.failure();
+    NewContent content(*host, path);
+    const auto taken = appendFrom(source, count, content, sourcePath);
+    if (!taken)
+        return taken.failure();
+    if (!content.failed() && *taken != count)
+        return fault(Failure::Kind::Damaged, sourcePath, QStringLiteral("the file became shorter meanwhile"));
+    if (m_files.fileExists(path)) {
+        const auto old = openSource(*host, path);
+        if (!old)
+            return old.failure();
+        if (const auto skipped = skipTo(*old, count, path); !skipped)
+            return skipped.failure();
+        if (const auto tail = appendFrom(*old, toTheEnd, content, path); !tail)
+            return tail.failure();
+    }
+    return content.commit();
+}
+
+Joined Mod4split::MergeFamily(const QString& piecePath) const {
+    Joined joined;
+    if (piecePath.isEmpty())
+        return joined;
+    const auto refuse = [&joined](Failure failure) {
+        joined.failure = std::move(failure);
+        return joined;
+    };
+    const auto name = JoinedName(LeafName(piecePath));
+    if (!name)
+        return refuse(fault(Failure::Kind::Unsupported, piecePath,
+                            QStringLiteral("no piece: the name is shorter than a name and \"_001_001.prk\"")));
+    const QString folder = JoinDrivePath(ParentFolder(piecePath), moorkavim);
+    // A family that has gone meanwhile leaves no empty folder.
+    if (m_files.fileExists(PieceBeside(piecePath, 1))) {
+        if (const auto made = m_files.makeFolder(folder); !made)
+            return refuse(made.failure());
+    }
+    return JoinPieces(piecePath, JoinDrivePath(folder, *name));
+}
+
+Joined Mod4split::JoinPieces(const QString& piecePath, const QString& outputPath) const {
+    Joined joined;
+    joined.declared = DeclaredTotal(piecePath);
+    const auto bytes = appendPieces(piecePath, outputPath, joined);
+    if (!bytes) {
+        joined.failure = bytes.failure();
+        return joined;
+    }
+    joined.bytes = *bytes;
+    if (!joined.stopped)
+        joined.file = outputPath;
+    return joined;
+}
+
+Result<qint64> Mod4split::appendPieces(const QString& piecePath, const QString& outputPath, Joined& joined) const {
+    int count = 0;
+    while (count < mostPieces && m_files.fileExists(PieceBeside(piecePath, count + 1)))
+        ++count;
+    if (count == 0)
+        return fault(Failure::Kind::NotFound, PieceBeside(piecePath, 1),
+                     QStringLiteral("the first piece is not there"));
+    const auto target = m_files.host(outputPath);
+    if (!target)
+        return target.failure();
+    NewContent content(*target, outputPath);
+    qint64 bytes = 0;
+    for (int number = 1; number <= count && !content.failed(); ++number) {
+        joined.stopped = !m_step(number - 1, count);
+        if (joined.stopped)
+            return 0;
+        const QString path = PieceBeside(piecePath, number);
+        const auto host = m_files.host(path);
+        if (!host)
+            return host.failure();
+        const auto piece = openSource(*host, path);
+        if (!piece)
+            return piece.failure();
+        const auto appended = appendFrom(*piece, toTheEnd, content, path);
+        if (!appended)
+            return appended.failure();
+        bytes += *appended;
+    }
+    if (const auto written = content.commit(); !written)
+        return written.failure();
+    joined.pieces = count;
+    return bytes;
+}
+
+void ListSingles(const TextList& from, TextList& into) {
+    into.clear();
+    QSet<QString> keys;
+    for (const QString& path : from.items()) {
+        const QString key = FamilyKey(path);
+        if (!IsPiece(path) || keys.contains(key))
+            continue;
+        keys.insert(key);
+        into.append(path);
+    }
+}
+
+int CollectFamily(const TextList& families, const TextList& pieces, TextList& family) {
+    family.clear();
+    const QString single = families.currentItem();
+    const QString key = FamilyKey(single);
+    for (const QString& path : pieces.items()) {
+        if (FamilyKey(path) == key)
+            family.append(path);
+    }
+    return FamilyVerdict(DeclaredTotal(single), family.count());
+}
+
+int FamilyVerdict(int declared, int count) {
+    if (declared == count)
+        return familyComplete;
+    return count < declared ? count - declared : count - declared + surplusBase;
+}
+
+int DeclaredTotal(const QString& piecePath) {
+    return static_cast<int>(Val(PieceTotal(piecePath)));
+}
+
+} // namespace lumora

@@ -1,0 +1,49 @@
+#pragma once
+
+#include "common/Result.h"
+#include "imaging/Bitmap.h"
+#include "imaging/files/PictureFile.h"
+
+#include <QByteArray>
+
+#include <array>
+#include <memory>
+
+namespace lumora {
+
+// One JPEG file on its way out: 4:2:0, the slow integer transform and the standard tables. Quality is held within 0 to
+// 100. An error of the encoder stays until finish() tells it.
+class JpegWriter {
+public:
+    enum class Input { Pixels, Planes };
+
+    // A luma plane of the picture's size and two chroma planes of half of it, rounded up.
+    static constexpr int lumaRows = 16;
+    static constexpr int chromaRows = 8;
+    struct PlaneRows {
+        std::array<unsigned char*, lumaRows> luma;
+        std::array<unsigned char*, chromaRows> cb;
+        std::array<unsigned char*, chromaRows> cr;
+    };
+
+    JpegWriter(PictureSize size, int quality, Input input);
+    ~JpegWriter();
+    JpegWriter(const JpegWriter&) = delete;
+    JpegWriter& operator=(const JpegWriter&) = delete;
+
+    // The next line of 32-bit pixels, alpha ignored.
+    void line(const unsigned char* pixels);
+    // The next 16 lines as planes, each row padded by its last sample to a multiple of 8.
+    void planeRows(PlaneRows& rows);
+
+    Result<QByteArray> finish();
+
+private:
+    struct State;
+    std::unique_ptr<State> m_state;
+};
+
+// What is transparent lies on white.
+Result<QByteArray> writeJpeg(const Bitmap& picture, int quality);
+
+} // namespace lumora

@@ -1,0 +1,105 @@
+#include "imaging/files/OtherPictures.h"
+
+#include "common/HostFile.h"
+
+#include <QBuffer>
+#include <QImageReader>
+#include <QtEndian>
+
+#include <cerrno>
+#include <mutex>
+
+namespace lumora {
+
+namespace {
+
+Result<QByteArray> readAll(const PictureInput& input) {
+    QByteArray bytes(input.size(), Qt::Uninitialized);
+    qsizetype filled = 0;
+    while (filled < bytes.size()) {
+        const std::ptrdiff_t got = input.read(bytes.data() + filled, static_cast<std::size_t>(bytes.size() - filled));
+        if (got < 0)
+            return fileFailure(input.path(), QStringLiteral("can't be read"), errno);
+        if (got == 0)
+            break;
+        filled += got;
+    }
+    bytes.truncate(filled);
+    return bytes;
+}
+
+// What the reader of BMP files does not look at: absurd sizes, which it takes for damage, and a file that breaks off,
+// which it takes for a whole one and leaves the rest black.
+Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
+    constexpr qsizetype headers = 14 + 40;
+    const auto* data = reinterpret_cast<const uchar*>(bytes.constData());
+    const bool oldHeader = bytes.size() >= 18 && qFromLittleEndian<quint32>(data + 14) == 12;
+    if (oldHeader)
+        return {};
+    const auto cutShort = [&] {
+        return pictureFailure(input.path(), Failure::Kind::Damaged, QStringLiteral("the picture is cut short"));
+    };
+    if (bytes.size() < headers)
+        return cutShort();
+    const qint64 offset = qFromLittleEndian<quint32>(data + 10);
+    const qint64 width = qFromLittleEndian<qint32>(data + 18);
+    const qint64 height = qAbs(static_cast<qint64>(qFromLittleEndian<qint32>(data + 22)));
+    const qint64 bits = qFromLittleEndian<quint16>(data + 28);
+    const auto compression = qFromLittleEndian<quint32>(data + 30);
+    if (auto bounds = checkPictureBounds(input.path(), width, height); !bounds)
+        return bounds;
+    const bool runLengths = compression == 1 || compression == 2; // there the size says nothing
+    if (!runLengths && offset + (width * bits + 31) / 32 * 4 * height > bytes.size())
+        return cutShort();
+    return {};
+}
+
+template <class Value, class Use>
+Result<Value> withReader(const PictureInput& input, const Use& use) {
+    // Our own bounds stand before each reading; Qt's limit of 128 MiB would refuse good pictures.
+    static std::once_flag limitLifted;
+    std::call_once(limitLifted, [] { QImageReader::setAllocationLimit(0); });
+
+    auto bytes = readAll(input);
+    if (!bytes)
+        return bytes.failure();
+    const bool bmp = input.format() == PictureInput::Format::Bmp;
+    if (bmp) {
+        if (auto checked = checkBmp(input, *bytes); !checked)
+            return checked.failure();
+    }
+    QBuffer buffer(&*bytes);
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer, bmp ? "bmp" : "png");
+    reader.setAutoTransform(false);
+    const QSize size = reader.size();
+    if (!size.isValid())
+        return pictureFailure(input.path(), Failure::Kind::Damaged,
+                              QStringLiteral("the picture is damaged or cut short"));
+    if (auto bounds = checkPictureBounds(input.path(), size.width(), size.height()); !bounds)
+        return bounds.failure();
+    return use(reader);
+}
+
+} // namespace
+
+Result<PictureSize> readOtherPictureSize(const PictureInput& input) {
+    return withReader<PictureSize>(input, [](QImageReader& reader) -> Result<PictureSize> {
+        return PictureSize{reader.size().width(), reader.size().height()};
+    });
+}
+
+Result<Bitmap> readOtherPicture(const PictureInput& input) {
+    return withReader<Bitmap>(input, [&input](QImageReader& reader) -> Result<Bitmap> {
+        QImage image = reader.read();
+        if (image.isNull())
+            return pictureFailure(input.path(), Failure::Kind::Damaged,
+                                  QStringLiteral("the picture is damaged or cut short"));
+        image.convertTo(image.hasAlphaChannel() ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
+        if (image.isNull())
+            return pictureFailure(input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+        return Bitmap(std::move(image));
+    });
+}
+
+} // namespace lumora

@@ -1,0 +1,90 @@
+#include "imaging/files/PictureInput.h"
+
+#include "common/HostFile.h"
+
+#include <array>
+#include <cerrno>
+#include <cstring>
+#include <fcntl.h>
+#include <string>
+#include <sys/stat.h>
+#include <unistd.h>
+#include <utility>
+
+namespace lumora {
+
+namespace {
+
+constexpr std::int64_t maxSide = 65500;
+constexpr std::int64_t maxPixels = 250'000'000;
+
+QString cannotBeRead() {
+    return QStringLiteral("can't be read");
+}
+
+} // namespace
+
+Failure pictureFailure(const std::filesystem::path& path, Failure::Kind kind, const QString& reason) {
+    const std::string name = path.string();
+    return {kind, QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())) + QStringLiteral(": ") + reason};
+}
+
+Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t width, std::int64_t height) {
+    if (width < 1 || height < 1)
+        return pictureFailure(path, Failure::Kind::Damaged, QStringLiteral("the picture has no pixels"));
+    if (width > maxSide || height > maxSide || width * height > maxPixels) {
+        return pictureFailure(path, Failure::Kind::TooLarge,
+                              QStringLiteral("the picture is too large, %1 x %2 pixels").arg(width).arg(height));
+    }
+    return {};
+}
+
+Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
+    PictureInput input;
+    input.m_path = path;
+    // A pipe that happens to be called .jpg must not make the page wait for a writer.
+    input.m_file = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+    struct stat status {};
+    if (input.m_file < 0 || ::fstat(input.m_file, &status) != 0)
+        return fileFailure(path, cannotBeRead(), errno);
+    if (!S_ISREG(status.st_mode))
+        return pictureFailure(path, Failure::Kind::Unsupported, QStringLiteral("is not a file"));
+    input.m_size = status.st_size;
+
+    std::array<unsigned char, 8> head{};
+    const ssize_t got = ::pread(input.m_file, head.data(), head.size(), 0);
+    if (got < 0)
+        return fileFailure(path, cannotBeRead(), errno);
+    if (got == 0)
+        return pictureFailure(path, Failure::Kind::Damaged, QStringLiteral("the file is empty"));
+    if (got >= 3 && std::memcmp(head.data(), "\xFF\xD8\xFF", 3) == 0)
+        input.m_format = Format::Jpeg;
+    else if (got >= 2 && std::memcmp(head.data(), "BM", 2) == 0)
+        input.m_format = Format::Bmp;
+    else if (got >= 8 && std::memcmp(head.data(), "\x89PNG\r\n\x1A\n", 8) == 0)
+        input.m_format = Format::Png;
+    else
+        return pictureFailure(path, Failure::Kind::Unsupported, QStringLiteral("is no picture of a known kind"));
+    return input;
+}
+
+PictureInput::PictureInput(PictureInput&& other) noexcept
+    : m_path(std::move(other.m_path))
+    , m_file(std::exchange(other.m_file, -1))
+    , m_size(other.m_size)
+    , m_format(other.m_format) {}
+
+PictureInput::~PictureInput() {
+    if (m_file >= 0)
+        ::close(m_file);
+}
+
+std::ptrdiff_t PictureInput::read(void* target, std::size_t count) const {
+    ssize_t got = 0;
+    do {
+        got = ::read(m_file, target, count);
+    } while (got < 0 && errno == EINTR);
+    return got;
+}
+
+} // namespace lumora

@@ -1,0 +1,45 @@
+#include "order/BrokenFiles.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "platform/files/Files.h"
+#include "session/TextList.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+QString BrokenFilesPath(const QString& orderFolder) {
+    return JoinDrivePath(orderFolder, QStringLiteral("kashloo.txt"));
+}
+
+Result<void> WriteBrokenFiles(const Files& files, const QString& orderFolder, const TextList& broken) {
+    QByteArray bytes;
+    for (const QString& path : broken.items())
+        bytes += AnsiCodePage::encode(path) + "\r\n";
+    return files.writeWhole(BrokenFilesPath(orderFolder), bytes);
+}
+
+QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder) {
+    const QString path = BrokenFilesPath(orderFolder);
+    if (!files.fileExists(path))
+        return {};
+    const auto bytes = files.read(path);
+    if (!bytes)
+        return {};
+    QStringList paths;
+    for (QByteArray line : bytes->split('\n')) {
+        if (line.endsWith('\r'))
+            line.chop(1);
+        if (!line.isEmpty())
+            paths.append(AnsiCodePage::decode(line));
+    }
+    return paths;
+}
+
+bool IsBroken(const TextList& broken, const QString& leafName) {
+    return std::any_of(broken.items().begin(), broken.items().end(),
+                       [&](const QString& path) { return LeafName(path) == leafName; });
+}
+
+} // namespace lumora

@@ -1,0 +1,51 @@
+#include "order/OrderTail.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/FixedText.h"
+#include "session/SessionState.h"
+
+namespace lumora {
+namespace {
+
+// Squeezed before it is cut, so that the width counts bytes too.
+QByteArray field(const QString& text, int width) {
+    return AnsiCodePage::encode(LeftField(AnsiCodePage::squeeze(text), width));
+}
+
+} // namespace
+
+OrderTail OrderTail::of(const SessionState& state) {
+    return {state.shemot.n2,     state.shemot.n1,  QString::number(state.shemot.TotalPics),
+            state.MisparHazmana, state.shemot.ser, {}};
+}
+
+QByteArray OrderTail::shortForm() const {
+    // The two leading ones once told the piece of a split print and the number of pieces.
+    return field(QStringLiteral("1"), 2) + field(QStringLiteral("1"), 2) + field(telephone, 10) + field(name, 10) +
+           field(totalPics, 3) + field(orderNumber, 3) + field(serial, 4) + field({}, 6);
+}
+
+QByteArray OrderTail::longForm(const QString& base) const {
+    return shortForm() + field(u'^' + RightPart(AnsiCodePage::squeeze(base), 19), 20);
+}
+
+QByteArray OrderTail::form(int SugTzad, const QString& base) const {
+    return SugTzad == longWidth ? longForm(base) : SugTzad == shortWidth ? shortForm() : QByteArray();
+}
+
+std::optional<OrderTail> OrderTail::parse(const QByteArray& bytes) {
+    if (bytes.size() != shortWidth && bytes.size() != longWidth)
+        return std::nullopt;
+    const auto read = [&](int at, int width) {
+        QString text = AnsiCodePage::decode(bytes.mid(at, width));
+        while (text.endsWith(u' '))
+            text.chop(1);
+        return text;
+    };
+    OrderTail tail{read(4, 10), read(14, 10), read(24, 3), read(27, 3), read(30, 4), {}};
+    if (bytes.size() == longWidth)
+        tail.baseName = read(shortWidth + 1, longWidth - shortWidth - 1);
+    return tail;
+}
+
+} // namespace lumora

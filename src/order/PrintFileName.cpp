@@ -1,0 +1,34 @@
+#include "order/PrintFileName.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+
+#include <QRegularExpression>
+
+namespace lumora {
+
+QString PrintFileName::text() const {
+    return code.left(9) + ZeroPadded(index, 4) + u'_' + QString::number(optint).rightJustified(2, u'0') +
+           TextToHex(RightPart(AnsiCodePage::squeeze(baseName), 20)) + QStringLiteral(".jpp");
+}
+
+std::optional<PrintFileName> PrintFileName::parse(const QString& name) {
+    static const QRegularExpression form(QRegularExpression::anchoredPattern(
+        QStringLiteral("(.{9})([0-9]{4})_([0-9]{2})((?:[0-9A-F]{2}){1,20})\\.jpp")));
+    const QRegularExpressionMatch match = form.match(name);
+    if (!match.hasMatch())
+        return std::nullopt;
+    return PrintFileName{match.captured(1), match.captured(2).toInt(), match.captured(3).toInt(),
+                         HexToChars(match.captured(4))};
+}
+
+int PrintFileName::copies() const {
+    return Val16(code.left(2));
+}
+
+QString PrintBaseName(const QString& path) {
+    return RightPart(NameWithoutEnding(path), 20);
+}
+
+} // namespace lumora

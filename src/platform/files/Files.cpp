@@ -1,0 +1,241 @@
+#include "platform/files/Files.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/HostFile.h"
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cerrno>
+
+namespace lumora {
+namespace fs = std::filesystem;
+namespace {
+
+// No file that is read whole comes near; what is larger was not meant.
+constexpr qint64 largestRead = qint64(1) << 30;
+
+Failure failure(Failure::Kind kind, const QString& path, const QString& reason) {
+    return {kind, QStringLiteral("%1: %2").arg(path, reason)};
+}
+
+// "*" any run of characters, "?" any one.
+bool matches(QStringView pattern, QStringView name) {
+    qsizetype p = 0;
+    qsizetype n = 0;
+    qsizetype star = -1;
+    qsizetype resume = 0;
+    while (n < name.size()) {
+        if (p < pattern.size() && pattern[p] == u'*') {
+            star = p++;
+            resume = n;
+        } else if (p < pattern.size() && (pattern[p] == u'?' || pattern[p].toCaseFolded() == name[n].toCaseFolded())) {
+            ++p;
+            ++n;
+        } else if (star >= 0) {
+            p = star + 1;
+            n = ++resume;
+        } else {
+            return false;
+        }
+    }
+    while (p < pattern.size() && pattern[p] == u'*')
+        ++p;
+    return p == pattern.size();
+}
+
+bool matchesAny(const QStringList& patterns, const QString& name) {
+    return std::any_of(patterns.begin(), patterns.end(), [&](const QString& pattern) {
+        return pattern == QLatin1String("*.*") || matches(pattern, name);
+    });
+}
+
+void sortWithoutCase(QStringList& names) {
+    std::sort(names.begin(), names.end(), [](const QString& a, const QString& b) {
+        const int order = QString::compare(a, b, Qt::CaseInsensitive);
+        return order != 0 ? order < 0 : a < b;
+    });
+}
+
+enum class Wanted { Files, Folders };
+
+// Names as they are, not yet squeezed into the code page. Hidden ones are left out.
+QStringList entries(const HostPath& folder, Wanted wanted, std::error_code& error) {
+    QStringList names;
+    for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
+        std::error_code unreadable;
+        const bool fits = wanted == Wanted::Files ? at->is_regular_file(unreadable) : at->is_directory(unreadable);
+        if (fits && !at->path().filename().native().starts_with('.'))
+            names += toDriveName(at->path().filename());
+    }
+    sortWithoutCase(names);
+    return names;
+}
+
+QStringList entries(const HostPath& folder, Wanted wanted) {
+    std::error_code passedOver;
+    return entries(folder, wanted, passedOver);
+}
+
+void collectInto(QStringList& all, const HostPath& folder, const QString& shown, Files::Depth depth,
+                 QStringList* unreadable) {
+    std::error_code error;
+    const QStringList files = entries(folder, Wanted::Files, error);
+    if (error && unreadable)
+        *unreadable += systemFailure(error.value(), shown).message;
+    for (const QString& name : files)
+        all += shown + u'\\' + AnsiCodePage::squeeze(name);
+    if (depth == Files::Depth::ThisFolder)
+        return;
+    for (const QString& name : entries(folder, Wanted::Folders)) {
+        const HostPath sub = folder / toHostPath(name);
+        // A link may lead back up, and the walk would never end.
+        if (!fs::is_symlink(sub))
+            collectInto(all, sub, shown + u'\\' + AnsiCodePage::squeeze(name), depth, unreadable);
+    }
+}
+
+Result<void> write(const Result<HostPath>& host, const QString& path, const QByteArray& bytes,
+                   NewContent::Durability durability) {
+    if (!host)
+        return host.failure();
+    NewContent content(*host, path);
+    content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
+    return content.commit(durability);
+}
+
+} // namespace
+
+Result<HostPath> Files::host(const QString& path) const {
+    if (path.contains(u'?'))
+        return failure(Failure::Kind::NotFound, path, QStringLiteral("the name holds a \"?\""));
+    if (auto found = m_drives.toHost(path))
+        return *found;
+    return failure(Failure::Kind::NotFound, path, QStringLiteral("no such drive or path"));
+}
+
+bool Files::fileExists(const QString& path) const {
+    const auto found = host(path);
+    std::error_code error;
+    return found && fs::is_regular_file(*found, error);
+}
+
+bool Files::folderExists(const QString& path) const {
+    const auto found = host(path);
+    std::error_code error;
+    return found && fs::is_directory(*found, error);
+}
+
+Result<void> Files::makeFolder(const QString& path) const {
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    if (::mkdir(found->c_str(), 0700) == 0 || (errno == EEXIST && folderExists(path)))
+        return {};
+    return systemFailure(errno, path);
+}
+
+Result<void> Files::removeFile(const QString& path) const {
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    if (::unlink(found->c_str()) != 0)
+        return systemFailure(errno, path);
+    return {};
+}
+
+Result<QByteArray> Files::read(const QString& path) const {
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    return readWholeFile(*found, path, largestRead);
+}
+
+Result<void> Files::writeWhole(const QString& path, const QByteArray& bytes) const {
+    return write(host(path), path, bytes, NewContent::Durability::Synced);
+}
+
+Result<void> Files::writePassing(const QString& path, const QByteArray& bytes) const {
+    return write(host(path), path, bytes, NewContent::Durability::Passing);
+}
+
+Result<void> Files::copyFile(const QString& source, const QString& target) const {
+    const auto from = host(source);
+    if (!from)
+        return from.failure();
+    const auto to = host(target);
+    if (!to)
+        return to.failure();
+    const auto opened = openSource(*from, source);
+    if (!opened)
+        return opened.failure();
+    NewContent content(*to, target);
+    const auto copied = appendFrom(*opened, toTheEnd, content, source);
+    if (!copied)
+        return copied.failure();
+    return content.commit();
+}
+
+Result<qint64> Files::size(const QString& path) const {
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    struct stat status {};
+    if (::stat(found->c_str(), &status) != 0)
+        return systemFailure(errno, path);
+    if (!S_ISREG(status.st_mode))
+        return failure(Failure::Kind::Unsupported, path, QStringLiteral("not a file"));
+    return static_cast<qint64>(status.st_size);
+}
+
+QStringList Files::names(const QString& folder, const QString& patterns) const {
+    QStringList wanted;
+    for (const QString& pattern : patterns.split(u';', Qt::SkipEmptyParts))
+        wanted += pattern.trimmed();
+    const auto found = host(folder);
+    QStringList names;
+    if (!found)
+        return names;
+    for (const QString& name : entries(*found, Wanted::Files)) {
+        if (matchesAny(wanted, name))
+            names += AnsiCodePage::squeeze(name);
+    }
+    return names;
+}
+
+QStringList Files::folders(const QString& folder) const {
+    const auto found = host(folder);
+    QStringList names;
+    if (!found)
+        return names;
+    for (const QString& name : entries(*found, Wanted::Folders))
+        names += AnsiCodePage::squeeze(name);
+    return names;
+}
+
+QStringList Files::collect(const QString& folder, Depth depth, QStringList* unreadable) const {
+    const auto found = host(folder);
+    QStringList all;
+    if (found)
+        collectInto(all, *found, folder.endsWith(u'\\') ? folder.chopped(1) : folder, depth, unreadable);
+    else if (unreadable)
+        *unreadable += found.failure().message;
+    return all;
+}
+
+void FileList::setFolder(const QString& folder) {
+    m_folder = folder;
+    refresh();
+}
+
+void FileList::setPattern(const QString& patterns) {
+    m_pattern = patterns;
+    refresh();
+}
+
+void FileList::refresh() {
+    m_names = m_files.names(m_folder, m_pattern);
+}
+
+} // namespace lumora

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "common/Result.h"
+#include "platform/line/Internet.h"
+#include "platform/line/TimeLimits.h"
+
+#include <QString>
+
+#include <functional>
+
+namespace lumora {
+
+// An answer that is kept in memory is a few words of a script.
+constexpr qsizetype largestFetchedBody = 16 * 1024 * 1024;
+// One that becomes a file is a list or a picture of the start page; a server that never ends must not fill the disk.
+constexpr qint64 largestDownload = 64 * 1024 * 1024;
+
+// Takes the next bytes of the body; false gives the answer up.
+using BodySink = std::function<bool(const char* bytes, std::size_t count)>;
+
+// GET past every cache; the status code. A body that ends before its announced length is a failure. http only.
+Result<int> HttpGet(const QString& url, const TimeLimits& limits, const BodySink& sink);
+
+// POST; the status code. The body goes out from where it lies, in pieces, and is never copied whole.
+Result<int> HttpPost(const QString& url, const PostRequest& post, const TimeLimits& limits, const BodySink& sink);
+
+// The request target as it goes over the wire: the ANSI bytes of the text from behind the host on, CR, LF and NUL made
+// blanks, a blank made %20, since a raw one would end the target in the request line. Nothing else is touched.
+QByteArray HttpTarget(const QString& pathAndQuery);
+
+} // namespace lumora

@@ -1,0 +1,27 @@
+#pragma once
+
+#include "platform/line/FtpSessionWire.h"
+#include "platform/line/Internet.h"
+
+namespace lumora {
+
+// The line of the running program.
+class PocoInternet : public Internet {
+public:
+    explicit PocoInternet(TimeLimits limits = {})
+        : m_limits(limits) {}
+
+    bool open() override { return connectedState(); }
+    // An interface with an address is up; which net it leads to is for the calls to find out.
+    bool connectedState() const override;
+    Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
+                                                      DataChannel channel) override;
+    Result<QByteArray> fetch(const QString& url) override;
+    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<void> download(const QString& url, const HostPath& target) override;
+
+private:
+    TimeLimits m_limits;
+};
+
+} // namespace lumora

@@ -1,0 +1,55 @@
+#include "session/lab/ClientProfile.h"
+
+#include "session/lab/Deployment.h"
+
+namespace lumora {
+
+namespace {
+
+// Entries from the first one without a default on keep what they hold.
+template <std::size_t N>
+void setSizes(std::array<QString, N>& sizes, const std::array<QString, N>& given, std::size_t withDefault) {
+    for (std::size_t i = 0; i < N; ++i) {
+        if (i < withDefault || !given[i].isEmpty())
+            sizes[i] = given[i];
+    }
+}
+
+} // namespace
+
+void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
+    ClientProfile profile = deployment.profile;
+    profile.ServerKey = state.profile.ServerKey;
+    profile.SizeList = state.profile.SizeList;
+    profile.QuickSizes = state.profile.QuickSizes;
+    setSizes(profile.SizeList, deployment.profile.SizeList, 9);
+    setSizes(profile.QuickSizes, deployment.profile.QuickSizes, 2);
+    if (profile.PriceListUrl.isEmpty())
+        profile.PriceListUrl = profile.SiteUrl + QStringLiteral("album_pricelist");
+    profile.PriceListUrl2 = profile.PriceListUrl;
+    // The site's address ends in a slash already: two slashes in a row are how these addresses read.
+    profile.AdUrl1 = profile.SiteUrl + QStringLiteral("/ad01.jpg");
+    profile.AdUrl2 = profile.SiteUrl + QStringLiteral("/ad02.jpg");
+    // Without "2000" in front, unlike the workspace: an installation places these pictures.
+    profile.AdFile1 = state.DiskRoot + QStringLiteral("lumora\\zmany\\ad01.jpg");
+    profile.AdFile2 = state.DiskRoot + QStringLiteral("lumora\\zmany\\ad02.jpg");
+    state.profile = std::move(profile);
+
+    state.MediniyutDchisa = deployment.MediniyutDchisa;
+    state.TachanaMekomit = deployment.TachanaMekomit;
+    state.DoarReshut = deployment.DoarReshut;
+    state.FitMuzag = deployment.FitMuzag;
+    state.GvulMuzag = deployment.GvulMuzag;
+    state.DegelEdit = false;
+    state.MinuyPaar = deployment.MinuyPaar;
+    state.TmunatPaar = deployment.TmunatPaar;
+    state.SplitPage = deployment.SplitPage;
+    state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
+    state.transfer.SugSheliach = deployment.SugSheliach;
+    state.coupon.HaKoopon = deployment.HaKoopon;
+    // With a limit of nothing a lab that takes coupons would get no order at all.
+    state.coupon.SmallCount = deployment.HaKoopon == 1 ? 220 : 0;
+    state.coupon.LargeCount = deployment.HaKoopon == 1 ? 3 : 0;
+}
+
+} // namespace lumora

@@ -1,0 +1,202 @@
+#include "transfer/ftp/UploadCheck.h"
+
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "order/BrokenFiles.h"
+
+#include <array>
+#include <vector>
+
+namespace lumora {
+
+namespace {
+
+enum class Step { Pause, Recheck, Delete, Close, Confirm, List };
+
+const std::vector<Step>& stepsOf(int attempt) {
+    using enum Step;
+    static const std::vector<Step> first = {Pause,   Recheck, Pause, Delete,  Close,   Recheck, Delete, Close,
+                                            Recheck, Delete,  Close, Recheck, Confirm, Close,   List};
+    static const std::vector<Step> middle = {Pause, Recheck, Pause, Delete, Close, Recheck, Pause,   Delete,
+                                             Close, Recheck, Pause, Delete, Close, Recheck, Confirm, List};
+    static const std::vector<Step> last = {Pause,  Recheck, Pause,   Delete,  Close, Recheck,
+                                           Delete, Close,   Recheck, Confirm, List};
+    return attempt == 1 ? first : attempt == 4 ? last : middle;
+}
+
+// Removing while walking skips the entry behind the one removed, so that the list is walked this often.
+constexpr int filterWalks = 3;
+
+} // namespace
+
+void UploadCheck::check(int attempt) {
+    m_freshListing = false;
+    for (const Step step : stepsOf(attempt)) {
+        if (m_desk.left)
+            return;
+        switch (step) {
+        case Step::Pause:
+            m_session.PauseBar();
+            break;
+        case Step::Recheck:
+            RecheckBroken();
+            break;
+        case Step::Delete:
+            DeleteBrokenFiles();
+            break;
+        case Step::Close:
+            m_session.FtpCloseConnection();
+            break;
+        case Step::Confirm:
+            ConfirmBrokenGone();
+            break;
+        case Step::List:
+            ListServerFiles();
+            break;
+        }
+    }
+}
+
+void UploadCheck::freshConnection() {
+    m_session.PauseBar();
+    m_session.FtpCloseConnection();
+    m_session.PauseBar();
+    m_desk.pump();
+    m_session.PauseBar(3);
+    m_session.reconnect(FtpSession::Captions::Follow);
+}
+
+bool UploadCheck::lookUp() {
+    const QString& name = m_desk.state.transfer.ShemTikiya;
+    // One folder of that name can be entered, however often the listing has it.
+    return m_board.List5.contains(name) && m_session.enterListedFolder(name);
+}
+
+void UploadCheck::filterDots() {
+    for (int walk = 0; walk < filterWalks; ++walk) {
+        const int count = m_board.List6.count();
+        for (int i = 0; i < count; ++i) {
+            const QString name = m_board.List6.item(i);
+            if (name == QStringLiteral(".") || name == QStringLiteral(".."))
+                m_board.List6.removeAt(i);
+        }
+    }
+}
+
+void UploadCheck::count() {
+    int names = 0;
+    for (const QString& name : m_board.List6.items()) {
+        if (!IsBroken(m_board.List4Broken, name))
+            ++names;
+    }
+    NumOnServer = HoldIn16Bits(names);
+}
+
+void UploadCheck::tellCount(const QString& hebrew) {
+    m_desk.status(QString::number(NumOnServer) +
+                  m_desk.wording(hebrew, QStringLiteral(" files uploaded successfully ")));
+}
+
+void UploadCheck::ListServerFiles() {
+    freshCount = false;
+    freshConnection();
+    if (m_desk.left)
+        return;
+    if (!m_session.insideOrderBase()) {
+        m_desk.status(
+            m_desk.wording(QStringLiteral("מחוץ לתיקייה הרצוייה"), QStringLiteral("Outside the desired folder")));
+        return;
+    }
+    freshCount = lookUp();
+    if (freshCount) {
+        count();
+        tellCount(QStringLiteral("קבצים שהועלו בהצלחה"));
+    }
+    filterDots();
+    count();
+    tellCount(QStringLiteral(" קבצים שהועלו בהצלחה "));
+    m_session.FtpCloseConnection();
+}
+
+void UploadCheck::RecheckBroken() {
+    m_freshListing = false;
+    if (nothingBroken())
+        return;
+    freshConnection();
+    if (m_desk.left || !m_session.insideOrderBase())
+        return;
+    m_freshListing = lookUp();
+    m_desk.status(
+        m_desk.wording(QStringLiteral("בודק קבצים שנכשלו"), QStringLiteral("Checking the files that failed")));
+    filterDots();
+    count();
+    tellCount(QStringLiteral(" קבצים שהועלו בהצלחה "));
+}
+
+void UploadCheck::DeleteBrokenFiles() {
+    // Outside the order's folder a file of the same name belongs to somebody else.
+    if (nothingBroken() || !m_session.inOrderFolder())
+        return;
+    m_session.CurrentRemoteDir();
+    for (int walk = 0; walk < 2; ++walk) {
+        for (int i = 0; i < m_board.List4Broken.count() && !m_desk.left; ++i) {
+            m_board.List4Broken.setCurrentIndex(i);
+            m_session.remove(LeafName(m_board.List4Broken.item(i)).trimmed());
+            m_session.PauseBar();
+            m_desk.pump();
+            m_desk.pump();
+        }
+        if (walk == 0)
+            m_session.PauseBar(2);
+    }
+}
+
+void UploadCheck::ConfirmBrokenGone() {
+    // A listing from before the failed put would not show its remains.
+    if (nothingBroken() || !m_freshListing)
+        return;
+    m_session.PauseBar();
+    TextList& broken = m_board.List4Broken;
+    m_board.List4BrokenB.clear();
+    for (const QString& path : broken.items())
+        m_board.List4BrokenB.append(LeafName(path));
+    for (int i = 0; i < m_board.List4BrokenB.count() && !broken.isEmpty(); ++i) {
+        const QString name = m_board.List4BrokenB.item(i);
+        int last = -1;
+        for (int k = 0; k < broken.count(); ++k) {
+            if (LeafName(broken.item(k)) == name)
+                last = k;
+        }
+        if (!m_board.List6.contains(name))
+            broken.removeAt(last);
+    }
+    if (broken.count() < m_board.List4BrokenB.count())
+        m_session.keepBrokenFiles();
+}
+
+QStringList UploadCheck::missing() const {
+    QStringList paths;
+    for (const QString& path : m_board.List4Makor.items()) {
+        const QString name = LeafName(path);
+        if (!m_board.List6.contains(name) || IsBroken(m_board.List4Broken, name))
+            paths.append(path);
+    }
+    return paths;
+}
+
+void UploadCheck::RebuildMissing() {
+    if (NumOnServer >= m_board.List4Makor.count())
+        return;
+    const QStringList paths = missing();
+    m_board.List3.clear();
+    m_board.List3.append(paths);
+}
+
+void UploadCheck::DropAlreadySent() {
+    for (int i = m_board.List3.lastIndex(); i >= 0; --i) {
+        if (m_board.List6.contains(LeafName(m_board.List3.item(i))))
+            m_board.List3.removeAt(i);
+    }
+}
+
+} // namespace lumora

@@ -1,0 +1,62 @@
+#include "transfer/http/ServerList.h"
+
+#include "common/DrivePathText.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+namespace {
+
+constexpr qsizetype longestAnswer = 35;
+const QString total = QStringLiteral("total:");
+
+bool namesTotal(const QString& entry) {
+    return entry.contains(total, Qt::CaseInsensitive);
+}
+
+} // namespace
+
+QStringList ParseServerList(const QString& text) {
+    const QString whole = text.trimmed();
+    if (whole.size() <= longestAnswer)
+        return {};
+    QStringList entries = whole.split(QStringLiteral("~~"));
+    entries.removeIf([](const QString& entry) { return entry.trimmed().isEmpty(); });
+    return entries;
+}
+
+QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName) {
+    QStringList missing = files;
+    for (const QString& given : entries) {
+        const QString entry = given.trimmed().toLower();
+        if (namesTotal(entry) || entry == folderName.toLower())
+            continue;
+        const auto arrived = std::find_if(missing.begin(), missing.end(), [&](const QString& path) {
+            return LeafName(path).trimmed().toLower().contains(entry);
+        });
+        if (arrived != missing.end())
+            missing.erase(arrived);
+    }
+    return missing;
+}
+
+ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {
+    ServerAnswer read;
+    if (answer.contains(QStringLiteral("not"), Qt::CaseInsensitive))
+        return read;
+    read.entries = ParseServerList(answer);
+    read.namesFolder = std::any_of(read.entries.begin(), read.entries.end(),
+                                   [&](const QString& entry) { return entry.trimmed() == folderName; });
+    if (read.namesFolder && std::any_of(read.entries.begin(), read.entries.end(), namesTotal))
+        read.verdict = ServerVerdict::Listed;
+    return read;
+}
+
+QString ListFileName(int number) {
+    if (number < 0 || number > 3)
+        return {};
+    return number == 0 ? QStringLiteral("filelisthom.txt") : QStringLiteral("filelisthom%1.txt").arg(number);
+}
+
+} // namespace lumora

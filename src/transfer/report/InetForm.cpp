@@ -1,0 +1,56 @@
+#include "transfer/report/InetForm.h"
+
+#include "common/AnsiCodePage.h"
+#include "order/OrderReport.h"
+#include "platform/Dialogs.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
+#include "session/SessionState.h"
+
+namespace lumora {
+
+InetForm::InetForm(SessionState& state, const Platform& platform, PageChain& chain)
+    : Page(PageId::InetForm)
+    , m_state(state)
+    , m_platform(platform) {
+    Q_UNUSED(chain);
+}
+
+QString InetForm::FetchUrlSmall(const QString& url) {
+    if (!m_platform.internet.open())
+        m_platform.dialogs.message(m_state.wording(QStringLiteral("אין תקשורת"), QStringLiteral("No communication")));
+    const auto body = m_platform.internet.fetch(url);
+    return body ? AnsiCodePage::decode(*body) : QString();
+}
+
+void InetForm::Command1_Click() {
+    m_platform.pump.pump();
+    const QString query = OrderReportQuery(m_state);
+    const QString& script = m_state.profile.ReportUrl;
+    // The lab's site is used to a call of this address before each report.
+    TeshuvatSharat = FetchUrlSmall(script + QStringLiteral("c.txt"));
+    TeshuvatSharat = FetchUrlSmall(script + query);
+    Q_EMIT changed();
+}
+
+void InetForm::Command2_Click() {
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state));
+    Q_EMIT changed();
+}
+
+bool clsDownload::download(const QString& url, const QString& path) {
+    m_failure = {};
+    const auto target = m_platform.files.host(path);
+    if (!target) {
+        m_failure = target.failure();
+        return false;
+    }
+    (void)m_platform.internet.open();
+    if (const auto done = m_platform.internet.download(url, *target); !done)
+        m_failure = done.failure();
+    return true;
+}
+
+} // namespace lumora

@@ -1,0 +1,23 @@
+#pragma once
+
+#include "entry/notice/Havharot.h"
+#include "views/window/PageView.h"
+
+namespace lumora {
+
+class HavharotView : public PageView {
+    Q_OBJECT
+public:
+    HavharotView(Havharot& page, const SessionState& state, const Theme& theme);
+    QWidget* firstFocus() const override;
+    void escape() override { m_page.Command1_Click(); }
+
+protected:
+    void render() override;
+
+private:
+    Havharot& m_page;
+    QPushButton* m_goOn;
+};
+
+} // namespace lumora

@@ -1,0 +1,55 @@
+#pragma once
+
+#include "finished/pieces/SpltForm.h"
+#include "views/window/PageView.h"
+
+class QFrame;
+class QListWidget;
+class QProgressBar;
+
+namespace lumora {
+
+class SpltFormView : public PageView {
+    Q_OBJECT
+public:
+    SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme);
+    QWidget* firstFocus() const override;
+
+protected:
+    void render() override;
+
+private:
+    QWidget* makeCut();
+    QWidget* makeJoin();
+    QWidget* makeResult();
+    void makeBars();
+    // A list with its title over it. clicked null: only to look at.
+    QListWidget* makeList(QVBoxLayout& column, const QString& name, const TextList& list, const QString& hebrew,
+                          const QString& english, int stretch, void (SpltForm::*clicked)(int) = nullptr);
+    QPushButton* workButton(const QString& name, const Caption& caption, std::function<void()> clicked);
+    void renderFamilies();
+    void renderResult();
+
+    SpltForm& m_page;
+    QLabel* m_cutHead = nullptr;
+    QLabel* m_joinHead = nullptr;
+    QLabel* m_counts = nullptr;
+    QPushButton* m_cutFolder = nullptr;
+    QListWidget* m_families = nullptr;
+    QStringList m_familyWords; // as they stand in the rows
+    QLabel* m_length = nullptr;
+    QFrame* m_result = nullptr;
+    QLabel* m_resultSign = nullptr;
+    QLabel* m_resultLine = nullptr;
+    QLabel* m_resultWhere = nullptr;
+    QProgressBar* m_progress = nullptr;
+    struct Title {
+        QLabel* label;
+        QListWidget* list;
+        QString hebrew;
+        QString english;
+    };
+    std::vector<Title> m_titles;
+};
+
+} // namespace lumora

@@ -1,0 +1,166 @@
+#include "views/kit/Overlay.h"
+
+#include "views/kit/Keyboard.h"
+#include "views/kit/PageFrame.h"
+
+#include <QApplication>
+#include <QEvent>
+#include <QFrame>
+#include <QKeyEvent>
+#include <QPainter>
+#include <QVBoxLayout>
+
+namespace lumora {
+
+Overlay::Overlay(const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , m_theme(theme) {
+    hide();
+    m_card = new QFrame(this);
+    setRole(m_card, "card");
+    m_column = new QVBoxLayout(m_card);
+    m_column->setContentsMargins(theme.px(32), theme.px(28), theme.px(32), theme.px(28));
+    m_column->setSpacing(theme.px(16));
+    setFocusPolicy(Qt::StrongFocus);
+    parent->installEventFilter(this);
+}
+
+void Overlay::setCardWidth(double width) {
+    m_width = width;
+    place();
+}
+
+void Overlay::setFilling() {
+    m_filling = true;
+    place();
+}
+
+void Overlay::setOpen(bool open) {
+    if (m_open == open)
+        return;
+    m_open = open;
+    window()->update();
+    if (open) {
+        m_before = QApplication::focusWidget();
+        setGeometry(parentWidget()->rect());
+        show();
+        raise();
+        place();
+        (m_firstFocus ? m_firstFocus.data() : this)->setFocus(Qt::OtherFocusReason);
+    } else {
+        const bool hadFocus = isAncestorOf(QApplication::focusWidget()) || QApplication::focusWidget() == this;
+        hide();
+        if (hadFocus && m_before)
+            m_before->setFocus(Qt::OtherFocusReason);
+    }
+}
+
+void Overlay::setReveal(double share) {
+    share = std::min(share, 1.0);
+    if (m_reveal == share)
+        return;
+    m_reveal = share;
+    cutCard();
+}
+
+void Overlay::cutCard() {
+    if (m_reveal >= 1) {
+        m_card->clearMask();
+        return;
+    }
+    const int open = static_cast<int>(m_card->width() * m_reveal);
+    m_card->setMask(QRegion((m_card->width() - open) / 2, 0, open, m_card->height()));
+}
+
+void Overlay::place() {
+    const int room = m_theme.px(24);
+    const QSize available = size() - QSize(2 * room, 2 * room);
+    QSize wanted = available;
+    if (!m_filling) {
+        const int width = std::min(m_theme.px(m_width), available.width());
+        int height = m_card->layout()->hasHeightForWidth() ? m_card->layout()->totalHeightForWidth(width)
+                                                           : m_card->sizeHint().height();
+        height = std::max(height, m_card->minimumSizeHint().height());
+        wanted = {width, std::min(height, available.height())};
+    }
+    m_card->setGeometry((width() - wanted.width()) / 2, (height() - wanted.height()) / 2, wanted.width(),
+                        wanted.height());
+    cutCard();
+}
+
+bool Overlay::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == parentWidget() && event->type() == QEvent::Resize && m_open)
+        setGeometry(parentWidget()->rect());
+    return QWidget::eventFilter(watched, event);
+}
+
+bool Overlay::event(QEvent* event) {
+    if (event->type() == QEvent::LayoutRequest)
+        place();
+    return QWidget::event(event);
+}
+
+void Overlay::resizeEvent(QResizeEvent*) {
+    place();
+}
+
+bool Overlay::focusNextPrevChild(bool next) {
+    // The keyboard goes round inside the panel.
+    QWidget* from = QApplication::focusWidget();
+    QWidget* at = from ? from : this;
+    for (int i = 0; i < 1000; ++i) {
+        at = next ? at->nextInFocusChain() : at->previousInFocusChain();
+        if (at == from)
+            return true;
+        // The box inside a combo box hands the keyboard back to it.
+        if (at != this && isAncestorOf(at) && !at->focusProxy() && at->isVisible() && at->isEnabled() &&
+            (at->focusPolicy() & Qt::TabFocus)) {
+            at->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+            return true;
+        }
+    }
+    return true;
+}
+
+void Overlay::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Escape) {
+        Q_EMIT escaped();
+        event->accept();
+        return;
+    }
+    pressByEnter(*event, QApplication::focusWidget());
+    event->accept(); // nothing of the page below answers meanwhile
+}
+
+void Overlay::mousePressEvent(QMouseEvent* event) {
+    event->accept();
+}
+
+void Overlay::paintEvent(QPaintEvent*) {
+    // One veil, however many panels lie one above the other.
+    if (frontOverlay(*window()) == this)
+        QPainter(this).fillRect(rect(), Theme::Colour::Veil);
+}
+
+Overlay* frontOverlay(const QWidget& root) {
+    // A panel of the window itself lies above those of a page; among those of one parent the last child is in front.
+    const auto height = [&](const Overlay& overlay) {
+        return std::pair(overlay.parentWidget() == &root, overlay.parentWidget()->children().indexOf(&overlay));
+    };
+    Overlay* front = nullptr;
+    for (Overlay* overlay : root.findChildren<Overlay*>()) {
+        if (overlay->isOpen() && overlay->isVisible() && (!front || height(*front) < height(*overlay)))
+            front = overlay;
+    }
+    return front;
+}
+
+void giveFocus(QWidget& widget) {
+    Overlay* front = frontOverlay(*widget.window());
+    if (front && !front->isAncestorOf(&widget))
+        front->setFocusBehind(&widget);
+    else
+        widget.setFocus(Qt::OtherFocusReason);
+}
+
+} // namespace lumora

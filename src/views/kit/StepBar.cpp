@@ -1,0 +1,93 @@
+#include "views/kit/StepBar.h"
+
+#include <QPainter>
+
+namespace lumora {
+
+StepBar::StepBar(const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , m_theme(theme) {
+    setObjectName(QStringLiteral("stepBar"));
+    setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+}
+
+void StepBar::setTexts(const QStringList& names, const QString& spokenPrefix) {
+    m_names = names;
+    m_spokenPrefix = spokenPrefix;
+    speak();
+    updateGeometry();
+    update();
+}
+
+void StepBar::setStep(OrderStep step) {
+    m_step = step;
+    speak();
+    update();
+}
+
+void StepBar::speak() {
+    setAccessibleName(m_spokenPrefix +
+                      m_names.value(std::min(static_cast<int>(m_step), static_cast<int>(m_names.size()) - 1)));
+}
+
+QSize StepBar::sizeHint() const {
+    return {m_theme.px(600), m_theme.px(64)};
+}
+
+QSize StepBar::minimumSizeHint() const {
+    return {m_theme.px(440), m_theme.px(64)};
+}
+
+void StepBar::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    const int count = static_cast<int>(m_names.size());
+    if (count == 0)
+        return;
+    const int current = static_cast<int>(m_step);
+    const double slot = width() / static_cast<double>(count);
+    const double radius = m_theme.px(13);
+    const double y = m_theme.px(22);
+    const auto centre = [&](int i) {
+        const double along = slot * (i + 0.5);
+        return QPointF(layoutDirection() == Qt::RightToLeft ? width() - along : along, y);
+    };
+    for (int i = 0; i + 1 < count; ++i) {
+        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.px(3), Qt::SolidLine,
+                            Qt::RoundCap));
+        const QPointF a = centre(i);
+        const QPointF b = centre(i + 1);
+        const double inset = (b.x() > a.x() ? 1 : -1) * (radius + m_theme.px(7));
+        painter.drawLine(QPointF(a.x() + inset, y), QPointF(b.x() - inset, y));
+    }
+    for (int i = 0; i < count; ++i) {
+        const bool done = i < current;
+        const bool here = i == current;
+        const QPointF at = centre(i);
+        if (here) {
+            painter.setPen(Qt::NoPen);
+            painter.setBrush(Theme::Colour::PrimarySoft);
+            painter.drawEllipse(at, radius + m_theme.px(5), radius + m_theme.px(5));
+        }
+        painter.setPen(QPen(done || here ? Theme::Colour::Primary : Theme::Colour::Edge, m_theme.px(2)));
+        painter.setBrush(done || here ? Theme::Colour::Primary : Theme::Colour::Surface);
+        painter.drawEllipse(at, radius, radius);
+        if (done) {
+            const int size = m_theme.px(18);
+            painter.drawPixmap(QPointF(at.x() - size / 2.0, at.y() - size / 2.0),
+                               m_theme.icon(QStringLiteral("tick"), size, Qt::white));
+        } else {
+            painter.setFont(m_theme.font(Theme::Type::Small));
+            painter.setPen(here ? QColor(Qt::white) : Theme::Colour::Muted);
+            painter.drawText(QRectF(at.x() - radius, at.y() - radius, 2 * radius, 2 * radius), Qt::AlignCenter,
+                             QString::number(i + 1));
+        }
+        QFont font = m_theme.font(Theme::Type::Small);
+        font.setBold(here);
+        painter.setFont(font);
+        painter.setPen(here ? Theme::Colour::PrimaryDark : Theme::Colour::Muted);
+        painter.drawText(QRectF(at.x() - slot / 2, m_theme.px(41), slot, m_theme.px(22)), Qt::AlignCenter, m_names[i]);
+    }
+}
+
+} // namespace lumora

@@ -1,0 +1,119 @@
+#include "views/kit/ToolButton.h"
+
+#include "views/kit/PageFrame.h"
+
+#include <QPainter>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+ToolButton::ToolButton(const Theme& theme, QString icon, QSizeF size, QWidget* parent, Handlers handlers)
+    : HoldButton(std::move(handlers), parent)
+    , m_theme(theme)
+    , m_icon(std::move(icon))
+    , m_size(size) {
+    setRole(this, "tool");
+    setAttribute(Qt::WA_Hover);
+    setMouseTracking(true);
+    setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
+}
+
+void ToolButton::setInk(QColor colour) {
+    m_ink = colour;
+    update();
+}
+
+void ToolButton::setPicture(const QImage& picture) {
+    m_picture = picture;
+    update();
+}
+
+void ToolButton::setMarked(bool marked) {
+    if (m_marked == marked)
+        return;
+    m_marked = marked;
+    update();
+}
+
+QFont ToolButton::words() const {
+    QFont font = m_theme.font(Theme::Type::Small);
+    font.setBold(false); // said, or the painter would take the weight of a button
+    return font;
+}
+
+// One line where it fits, else two, broken at the blank that leaves the longer one shortest.
+QStringList ToolButton::lines() const {
+    QString said = text();
+    said.replace(u"&&"_s, u"&"_s).remove(QChar(0x2066)).remove(QChar(0x2069));
+    const QFontMetrics metrics(words());
+    const int room = m_theme.px(m_size.width()) - m_theme.px(6);
+    if (metrics.horizontalAdvance(said) <= room || !said.contains(u' '))
+        return {said};
+    QStringList best;
+    int least = 0;
+    for (qsizetype at = said.indexOf(u' '); at >= 0; at = said.indexOf(u' ', at + 1)) {
+        const QStringList two{said.left(at), said.mid(at + 1)};
+        const int longer = std::max(metrics.horizontalAdvance(two[0]), metrics.horizontalAdvance(two[1]));
+        if (best.isEmpty() || longer < least) {
+            best = two;
+            least = longer;
+        }
+    }
+    return best;
+}
+
+QSize ToolButton::sizeHint() const {
+    const QFontMetrics metrics(words());
+    int width = m_theme.px(m_size.width());
+    for (const QString& line : lines())
+        width = std::max(width, metrics.horizontalAdvance(line) + m_theme.px(4));
+    return {width, m_theme.px(m_size.height())};
+}
+
+QSize ToolButton::minimumSizeHint() const {
+    return {std::max(44, m_theme.px(m_size.width() * 0.8)), std::max(44, m_theme.px(m_size.height() * 0.9))};
+}
+
+void ToolButton::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
+    const bool lively = isEnabled() && (underMouse() || isDown());
+    const double thick = m_marked || isDown() ? m_theme.px(2) : 1;
+    const QRectF card = QRectF(rect()).adjusted(thick / 2, thick / 2, -thick / 2, -thick / 2);
+    painter.setPen(QPen(m_marked || lively ? Theme::Colour::Primary : Theme::Colour::Line, thick));
+    painter.setBrush(!isEnabled()           ? Theme::Colour::Sunken
+                     : isDown() || m_marked ? Theme::Colour::PrimarySoft
+                                            : Theme::Colour::Surface);
+    painter.drawRoundedRect(card, m_theme.px(11), m_theme.px(11));
+    if (isDown()) // sunk
+        painter.translate(0, m_theme.px(1));
+
+    const QStringList said = lines();
+    const double lineHeight = m_theme.px(16);
+    const double under = said.first().isEmpty() ? 0 : lineHeight * static_cast<double>(said.size());
+    const double signHeight =
+        std::min<double>(m_theme.px(m_picture.isNull() ? 26 : 40), height() - under - m_theme.px(6));
+    const double gap = m_theme.px(2);
+    const double top = (height() - signHeight - gap - under) / 2;
+    if (m_picture.isNull()) {
+        const int sign = static_cast<int>(signHeight);
+        painter.drawPixmap(QPointF((width() - sign) / 2.0, top),
+                           m_theme.icon(m_icon, sign, isEnabled() ? m_ink : Theme::Colour::Muted));
+    } else {
+        QRectF box(QPointF(),
+                   QSizeF(m_picture.size()).scaled(width() - m_theme.px(12), signHeight, Qt::KeepAspectRatio));
+        box.moveCenter({width() / 2.0, top + signHeight / 2});
+        painter.drawImage(box, m_picture);
+    }
+    painter.setFont(words());
+    painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
+    painter.setLayoutDirection(layoutDirection());
+    for (qsizetype i = 0; i < said.size(); ++i)
+        painter.drawText(QRectF(0, top + signHeight + gap + lineHeight * static_cast<double>(i), width(), lineHeight),
+                         Qt::AlignCenter | Qt::TextDontClip, said[i]);
+}
+
+} // namespace lumora

@@ -1,0 +1,105 @@
+#include "views/kyoskNew/LargePicture.h"
+
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+
+#include <utility>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+LargePicture::LargePicture(const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , m_theme(theme) {
+    setMinimumSize(theme.px(180), theme.px(120));
+}
+
+void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning, const QString& meaning) {
+    m_view = view;
+    m_warning = warning;
+    setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified()
+                      : view.warning       ? meaning + u". "_s + warning
+                                           : meaning);
+    setCursor(view.bitmap.isNull() ? Qt::ArrowCursor : Qt::PointingHandCursor);
+    setFocusPolicy(view.bitmap.isNull() ? Qt::NoFocus : Qt::TabFocus);
+    update();
+}
+
+void LargePicture::mousePressEvent(QMouseEvent* event) {
+    m_pressed = event->button() == Qt::LeftButton && !m_view.bitmap.isNull();
+}
+
+void LargePicture::mouseReleaseEvent(QMouseEvent* event) {
+    if (std::exchange(m_pressed, false) && rect().contains(event->position().toPoint()))
+        Q_EMIT clicked();
+}
+
+void LargePicture::keyPressEvent(QKeyEvent* event) {
+    const bool press = event->key() == Qt::Key_Space || event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
+    if (!press || m_view.bitmap.isNull())
+        return QWidget::keyPressEvent(event);
+    Q_EMIT clicked();
+}
+
+void LargePicture::paintEvent(QPaintEvent*) {
+    if (!m_view.visible)
+        return;
+    QPainter painter(this);
+    painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
+    if (m_view.bitmap.isNull()) {
+        QStringList lines;
+        for (const QString& line : m_view.guide) {
+            const QString words = line.trimmed();
+            // A row of arrows pointed to the small pictures; here the page's own layout does.
+            if (!words.isEmpty() && words != QString(words.size(), u'<'))
+                lines += words;
+        }
+        const int flags = Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap;
+        painter.setPen(Theme::Colour::Ink);
+        painter.setLayoutDirection(layoutDirection());
+        painter.setFont(m_theme.font(Theme::Type::Body));
+        const int sign = m_theme.px(44);
+        QRect words = rect().adjusted(0, sign + m_theme.px(20), 0, 0);
+        if (painter.boundingRect(words, flags, lines.join(u'\n')).height() > words.height()) {
+            painter.setFont(m_theme.font(Theme::Type::Small)); // little room: the words alone, and smaller
+            words = rect();
+        } else {
+            painter.drawPixmap(QPoint((width() - sign) / 2, m_theme.px(10)),
+                               m_theme.icon(u"info"_s, sign, Theme::Colour::Primary));
+        }
+        painter.drawText(words, flags, lines.join(u'\n'));
+        return;
+    }
+    const QImage& picture = m_view.bitmap.image();
+    const QSizeF fit = QSizeF(picture.size()).scaled(size(), Qt::KeepAspectRatio);
+    QRectF at(QPointF(), fit);
+    at.moveCenter(QRectF(rect()).center());
+    painter.drawImage(at, picture);
+    const int sign = m_theme.px(34);
+    const QRectF plate(at.right() - sign - m_theme.px(8), at.bottom() - sign - m_theme.px(8), sign, sign);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(QColor(255, 255, 255, 215));
+    painter.drawEllipse(plate);
+    const int inset = m_theme.px(6);
+    painter.drawPixmap(plate.topLeft() + QPointF(inset, inset),
+                       m_theme.icon(u"look"_s, sign - 2 * inset, Theme::Colour::Ink));
+    if (!m_view.warning)
+        return;
+    painter.setFont(m_theme.font(Theme::Type::Small));
+    const int icon = m_theme.px(22);
+    const QRectF room(at.left(), at.top(), at.width(), m_theme.px(48));
+    painter.fillRect(room, QColor(0xFD, 0xF0, 0xD9, 235));
+    const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
+    painter.drawPixmap(QPointF(rightToLeft ? room.right() - icon - m_theme.px(8) : room.left() + m_theme.px(8),
+                               room.center().y() - icon / 2.0),
+                       m_theme.icon(u"warning"_s, icon, Theme::Colour::Danger));
+    painter.setPen(Theme::Colour::Ink);
+    painter.setLayoutDirection(layoutDirection());
+    const int beside = icon + m_theme.px(14);
+    painter.drawText(room.adjusted(rightToLeft ? m_theme.px(6) : beside, 0, rightToLeft ? -beside : -m_theme.px(6), 0),
+                     Qt::AlignVCenter | Qt::AlignLeading | Qt::TextWordWrap, m_warning);
+}
+
+} // namespace lumora

@@ -1,0 +1,54 @@
+#pragma once
+
+#include "views/kit/Cards.h"
+
+class QLabel;
+class QPushButton;
+
+namespace lumora {
+
+// One of the twelve small pictures: a press chooses it; once chosen it wears a mark, and minus, the number of copies
+// and plus lie below. The keys + and - count too, and the arrows go to the neighbours.
+class PictureCell : public CardButton {
+    Q_OBJECT
+public:
+    PictureCell(const Theme& theme, QWidget* parent);
+
+    struct Look {
+        QImage picture;
+        bool filled = false; // there is a picture, readable or not
+        bool chosen = false;
+        bool inEditor = false;
+        QString copies;
+        QString name;
+    };
+    void show(const Look& look);
+
+    QPushButton* plus() const { return m_plus; }
+    QPushButton* minus() const { return m_minus; }
+    QLabel* copies() const { return m_copies; }
+    QWidget* mark() const { return m_strip; }
+    // Side of the square that is left for the picture, in pixels of the screen.
+    int pictureSide() const;
+
+Q_SIGNALS:
+    void arrow(int columns, int rows);
+    void resized();
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void paintInside(QPainter&, const QRectF&) override {}
+    void keyPressEvent(QKeyEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    QRect pictureRoom() const;
+
+    Look m_look;
+    QWidget* m_strip;
+    QPushButton* m_minus;
+    QLabel* m_copies;
+    QPushButton* m_plus;
+};
+
+} // namespace lumora

@@ -1,0 +1,69 @@
+#pragma once
+
+#include "entry/details/nnn.h"
+#include "views/window/PageView.h"
+
+#include <array>
+#include <memory>
+
+class QFrame;
+class QGridLayout;
+class QStackedLayout;
+
+namespace lumora {
+
+class BorderSample;
+class Tile;
+
+class nnnView : public PageView {
+    Q_OBJECT
+public:
+    nnnView(nnn& page, const SessionState& state, const Theme& theme);
+    ~nnnView() override;
+    QWidget* firstFocus() const override;
+    void escape() override;
+
+protected:
+    void render() override;
+
+private:
+    class Album;
+
+    QWidget* makeMenu();
+    QWidget* makeDetails();
+    QWidget* makeOptions();
+    QWidget* makeBorders();
+    QWidget* makeFit();
+    QWidget* makeTerms();
+    void makeBars();
+    void placeTiles();
+
+    nnn& m_page;
+    std::unique_ptr<Album> m_album;
+    QStackedLayout* m_steps;
+    std::array<Tile*, 10> m_tiles{};
+    QGridLayout* m_tileGrid = nullptr;
+    QList<int> m_placed;
+    QLineEdit* m_name = nullptr;
+    QLineEdit* m_telephone = nullptr;
+    QLineEdit* m_address = nullptr;
+    QPushButton* m_toOptions = nullptr;
+    QPushButton* m_toBorders = nullptr;
+    QPushButton* m_fromBorder = nullptr;
+    QPushButton* m_finish = nullptr;
+    QPushButton* m_back = nullptr;
+    QComboBox* m_moreSizes = nullptr;
+    BorderSample* m_sample = nullptr;
+    QLabel* m_sampleName = nullptr;
+    QFrame* m_hint = nullptr;
+    QLabel* m_termsHead = nullptr;
+    QLabel* m_chosen = nullptr;
+    QLabel* m_chosenHead = nullptr;
+    QLabel* m_choiceStatus = nullptr;
+    QLabel* m_coupon = nullptr;
+    Overlay* m_clean = nullptr;
+    nnn::Step m_shownStep = nnn::Step::Menu;
+    int m_focusRequest = 0;
+};
+
+} // namespace lumora

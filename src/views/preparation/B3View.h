@@ -1,0 +1,28 @@
+#pragma once
+
+#include "assembly/edited/B3.h"
+#include "views/preparation/PreparationView.h"
+
+class QListWidget;
+
+namespace lumora {
+
+class B3View : public PreparationView {
+    Q_OBJECT
+public:
+    B3View(B3& page, const SessionState& state, const Theme& theme);
+    QWidget* firstFocus() const override;
+
+protected:
+    void render() override;
+
+private:
+    B3& m_page;
+    PictureBox* m_picture;
+    QFrame* m_pictureCard;
+    QListWidget* m_list;
+    QFrame* m_listCard;
+    QPushButton* m_start;
+};
+
+} // namespace lumora

@@ -1,0 +1,236 @@
+#include "views/tFrmNew/EditorPaper.h"
+
+#include <QMouseEvent>
+#include <QPainter>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr QColor table{0x2C, 0x31, 0x36};
+constexpr QColor words{0xE9, 0xEA, 0xEB};
+constexpr double handleRadius = 18; // of a crop handle, in logical pixels
+
+constexpr CropFrame::Corner corners[] = {CropFrame::Corner::Picture11, CropFrame::Corner::Picture9,
+                                         CropFrame::Corner::Picture10, CropFrame::Corner::Picture14};
+
+// The dashed box of the caption. Black and white dashes, so that it shows on any picture.
+class CaptionBox : public QWidget {
+public:
+    explicit CaptionBox(QWidget* parent)
+        : QWidget(parent) {
+        setCursor(Qt::SizeAllCursor);
+        hide();
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override {
+        QPainter painter(this);
+        const QRectF box = QRectF(rect()).adjusted(1, 1, -1, -1);
+        painter.fillRect(box, QColor(255, 255, 255, 40));
+        painter.setPen(QPen(QColor(0x1D, 0x25, 0x2C), 2));
+        painter.drawRect(box);
+        QPen dashes(Qt::white, 2);
+        dashes.setDashPattern({3, 3});
+        painter.setPen(dashes);
+        painter.drawRect(box);
+    }
+};
+
+} // namespace
+
+EditorPaper::EditorPaper(tFrmNew& page, QWidget* parent)
+    : QWidget(parent)
+    , m_page(page)
+    , m_caption(new CaptionBox(this)) {
+    setMouseTracking(true);
+    setCursor(Qt::OpenHandCursor);
+    setAttribute(Qt::WA_OpaquePaintEvent);
+    m_caption->installEventFilter(this);
+}
+
+void EditorPaper::render() {
+    m_scale = m_page.PicPicSize.width > 0 ? double(width()) / m_page.PicPicSize.width : 1;
+    const TextLabelBox& box = m_page.LabeltextBox;
+    // A finger needs some room, however small the caption is.
+    QRectF area(box.left * m_scale, box.top * m_scale, box.width * m_scale, box.height * m_scale);
+    const QPointF middle = area.center();
+    area.setSize({std::max(area.width(), 44.0), std::max(area.height(), 44.0)});
+    area.moveCenter(middle);
+    if (m_caption->geometry() != area.toRect())
+        m_caption->setGeometry(area.toRect());
+    if (m_caption->isHidden() == m_page.Labeltext.visible)
+        m_caption->setVisible(m_page.Labeltext.visible);
+    // The same bitmap draws the same: a change elsewhere on the page leaves the paper alone.
+    if (m_shown.cacheKey() != m_page.PicPic.image().cacheKey() || m_page.crop.visible) {
+        m_shown = m_page.PicPic.image();
+        update();
+    }
+}
+
+void EditorPaper::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    if (m_shown.isNull()) {
+        painter.fillRect(rect(), Qt::white);
+        return;
+    }
+    const double ratio = devicePixelRatioF();
+    const bool asItIs = m_shown.size() == (QSizeF(size()) * ratio).toSize();
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, !asItIs);
+    painter.drawImage(rect(), m_shown);
+    if (!m_page.crop.visible)
+        return;
+    painter.setRenderHint(QPainter::Antialiasing);
+    QPolygonF sides;
+    for (const int at : {0, 1, 3, 2})
+        sides << QPointF(m_page.crop.marker(corners[at])) * m_scale;
+    painter.setPen(QPen(Theme::Colour::Sun, 2));
+    painter.drawPolygon(sides);
+    painter.setBrush(Theme::Colour::Sun);
+    for (const CropFrame::Corner corner : corners)
+        painter.drawEllipse(m_page.crop.handle(corner) * m_scale, 8, 8);
+}
+
+void EditorPaper::drag(QEvent::Type type, QPointF at) {
+    const bool down = type == QEvent::MouseButtonPress;
+    const bool up = type == QEvent::MouseButtonRelease;
+    switch (m_drag) {
+    case Drag::Caption:
+        down ? m_page.Labeltext_MouseDown(at) : up ? m_page.Labeltext_MouseUp() : m_page.Labeltext_MouseMove(at);
+        break;
+    case Drag::CropHandle:
+        up ? m_page.CropHandle_MouseUp() : m_page.CropHandle_MouseMove(at);
+        break;
+    case Drag::Picture:
+        down ? m_page.PicPic_MouseDown(at) : up ? m_page.PicPic_MouseUp() : m_page.PicPic_MouseMove(at);
+        break;
+    case Drag::None:
+        if (!down && !up)
+            m_page.PicPic_MouseMove(at); // closes the panels
+        break;
+    }
+    if (up)
+        m_drag = Drag::None;
+}
+
+void EditorPaper::mousePressEvent(QMouseEvent* event) {
+    if (event->button() != Qt::LeftButton)
+        return;
+    const QPointF at = onPaper(event->position());
+    m_drag = Drag::Picture;
+    for (const CropFrame::Corner corner : corners) {
+        if (m_page.crop.visible && QLineF(at, m_page.crop.handle(corner)).length() < handleRadius) {
+            m_drag = Drag::CropHandle;
+            m_page.CropHandle_MouseDown(corner, at);
+            return;
+        }
+    }
+    setCursor(Qt::ClosedHandCursor);
+    drag(QEvent::MouseButtonPress, at);
+}
+
+void EditorPaper::mouseMoveEvent(QMouseEvent* event) {
+    drag(QEvent::MouseMove, onPaper(event->position()));
+}
+
+void EditorPaper::mouseReleaseEvent(QMouseEvent* event) {
+    if (event->button() != Qt::LeftButton)
+        return;
+    setCursor(Qt::OpenHandCursor);
+    drag(QEvent::MouseButtonRelease, onPaper(event->position()));
+}
+
+// The pointer is lost with the widget that holds it.
+void EditorPaper::hideEvent(QHideEvent* event) {
+    if (m_drag != Drag::None)
+        drag(QEvent::MouseButtonRelease, {});
+    QWidget::hideEvent(event);
+}
+
+bool EditorPaper::eventFilter(QObject* watched, QEvent* event) {
+    if (watched != m_caption)
+        return QWidget::eventFilter(watched, event);
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseMove:
+    case QEvent::MouseButtonRelease: {
+        const auto& mouse = static_cast<QMouseEvent&>(*event);
+        if (event->type() != QEvent::MouseMove && mouse.button() != Qt::LeftButton)
+            return true;
+        if (event->type() == QEvent::MouseButtonPress)
+            m_drag = Drag::Caption;
+        if (m_drag == Drag::Caption)
+            drag(event->type(), onPaper(m_caption->mapToParent(mouse.position())));
+        return true;
+    }
+    case QEvent::Hide:
+        if (m_drag == Drag::Caption)
+            drag(QEvent::MouseButtonRelease, {});
+        break;
+    default:
+        break;
+    }
+    return QWidget::eventFilter(watched, event);
+}
+
+EditorTable::EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , m_page(page)
+    , m_theme(theme)
+    , m_paper(new EditorPaper(page, this)) {
+    setMinimumSize(theme.px(200), theme.px(150));
+    setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
+}
+
+void EditorTable::render(const QString& said) {
+    const QSize room = size() - QSize(m_theme.px(20), m_theme.px(20));
+    const PictureSize paper = m_page.PicPicSize;
+    const bool open = m_page.pictureOpen() && paper.width > 0 && paper.height > 0 && room.width() > 0;
+    m_paper->setVisible(open);
+    if (m_words != said) {
+        m_words = said;
+        update();
+    }
+    if (!open)
+        return;
+    const double scale = std::min(double(room.width()) / paper.width, double(room.height()) / paper.height);
+    const QSize fit(qRound(paper.width * scale), qRound(paper.height * scale));
+    const QRect place(QPoint((width() - fit.width()) / 2, (height() - fit.height()) / 2), fit);
+    if (m_paper->geometry() != place) {
+        m_paper->setGeometry(place);
+        update();
+    }
+    m_page.setPreviewScale(scale * devicePixelRatioF());
+    m_paper->render();
+}
+
+void EditorTable::resizeEvent(QResizeEvent*) {
+    if (m_page.pictureOpen())
+        render(m_words);
+}
+
+void EditorTable::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(table);
+    painter.drawRoundedRect(rect(), m_theme.corner(), m_theme.corner());
+    if (m_paper->isVisible()) {
+        const QRectF paper = m_paper->geometry();
+        for (int i = 4; i >= 1; --i) { // a soft shadow
+            painter.setBrush(QColor(0, 0, 0, 28));
+            painter.drawRoundedRect(paper.adjusted(-i, -i + 2, i, i + 2), i, i);
+        }
+    } else {
+        painter.setPen(words);
+        painter.setFont(m_theme.font(Theme::Type::Large));
+        painter.setLayoutDirection(layoutDirection());
+        painter.drawText(rect().adjusted(20, 20, -20, -20), Qt::AlignCenter | Qt::TextWordWrap, m_words);
+    }
+}
+
+} // namespace lumora

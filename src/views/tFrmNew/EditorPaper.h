@@ -1,0 +1,62 @@
+#pragma once
+
+#include "editing/editor/tFrmNew.h"
+#include "views/kit/Theme.h"
+
+#include <QEvent>
+#include <QWidget>
+
+namespace lumora {
+
+// The paper on the editor's table, as large as the table lets it be. It draws the page's preview as it is and hands on
+// where the mouse or the finger is, in logical pixels of the paper.
+class EditorPaper : public QWidget {
+    Q_OBJECT
+public:
+    explicit EditorPaper(tFrmNew& page, QWidget* parent);
+
+    void render();
+    QWidget* captionBox() const { return m_caption; }
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    enum class Drag { None, Picture, Caption, CropHandle };
+    QPointF onPaper(QPointF position) const { return position / m_scale; }
+    void drag(QEvent::Type type, QPointF at);
+
+    tFrmNew& m_page;
+    QWidget* m_caption; // the dashed box, which lies over the picture
+    QImage m_shown;
+    double m_scale = 1; // of the widget's pixels to the paper's
+    Drag m_drag = Drag::None;
+};
+
+// What the paper lies on: dark and neutral, so that colours are seen as they are.
+class EditorTable : public QWidget {
+    Q_OBJECT
+public:
+    EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent);
+
+    EditorPaper& paper() const { return *m_paper; }
+    // Fits the paper into the table. words: what stands there while no picture is open.
+    void render(const QString& words);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    tFrmNew& m_page;
+    const Theme& m_theme;
+    EditorPaper* m_paper;
+    QString m_words;
+};
+
+} // namespace lumora

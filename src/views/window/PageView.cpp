@@ -1,0 +1,312 @@
+#include "views/window/PageView.h"
+
+#include "views/kit/Cards.h"
+#include "views/kit/ChoiceCards.h"
+#include "views/kit/Keyboard.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QSignalBlocker>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// About a frame of the screen: long loops pump far more often than a person can see.
+constexpr int renderPace = 16;
+
+QString shownOnButton(const QString& text) {
+    return isolated(text.trimmed()).replace(u'&', u"&&"_s);
+}
+
+void fillCombo(QComboBox& box, const TextList& list, const Caption& caption) {
+    const QSignalBlocker quiet(box);
+    bool same = box.count() == list.count();
+    for (int i = 0; same && i < list.count(); ++i)
+        same = box.itemData(i).toString() == list.item(i);
+    if (!same) {
+        box.clear();
+        for (const QString& item : list.items())
+            box.addItem(isolated(item), item);
+    }
+    const int row = list.find(caption.text);
+    box.setPlaceholderText(isolated(caption.text));
+    if (box.currentIndex() != row)
+        box.setCurrentIndex(row);
+}
+
+void fillList(QListWidget& widget, const TextList& list, const std::function<QString(const QString&)>& shown) {
+    const QSignalBlocker quiet(widget);
+    bool same = widget.count() == list.count();
+    for (int i = 0; same && i < list.count(); ++i)
+        same = widget.item(i)->data(Qt::UserRole).toString() == list.item(i);
+    if (!same) {
+        widget.clear();
+        for (const QString& item : list.items()) {
+            auto* row = new QListWidgetItem(isolated(shown ? shown(item) : item.trimmed()), &widget);
+            row->setData(Qt::UserRole, item);
+        }
+    }
+    if (widget.currentRow() != list.currentIndex())
+        widget.setCurrentRow(list.currentIndex());
+}
+
+} // namespace
+
+PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
+    : m_page(page)
+    , m_state(state)
+    , m_theme(theme) {
+    setObjectName(pageName(page.id()));
+    setRole(this, "page");
+    setAttribute(Qt::WA_StyledBackground);
+    setFocusPolicy(Qt::NoFocus);
+    auto* column = new QVBoxLayout(this);
+    column->setContentsMargins(0, 0, 0, 0);
+    m_frame = new PageFrame(theme, this);
+    column->addWidget(m_frame);
+    m_soon.setSingleShot(true);
+    connect(&m_soon, &QTimer::timeout, this, &PageView::renderNow);
+    connect(&page, &Page::changed, this, &PageView::schedule);
+}
+
+void PageView::start() {
+    if (isPanel())
+        m_frame->showContentOnly();
+    m_dirty = true;
+    renderNow();
+}
+
+void PageView::schedule() {
+    m_dirty = true;
+    if (m_detached || m_soon.isActive())
+        return;
+    const qint64 since = m_sinceRender.isValid() ? m_sinceRender.elapsed() : renderPace;
+    m_soon.start(static_cast<int>(std::clamp<qint64>(renderPace - since, 0, renderPace)));
+}
+
+void PageView::renderNow() {
+    m_soon.stop();
+    if (m_detached || !m_dirty)
+        return;
+    m_dirty = false;
+    setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    m_frame->steps().setTexts(m_state.english()
+                                  ? QStringList{u"Start"_s, u"Details"_s, u"Pictures"_s, u"Preparing"_s, u"Sending"_s}
+                                  : QStringList{u"התחלה"_s, u"פרטים"_s, u"תמונות"_s, u"הכנה"_s, u"שליחה"_s},
+                              wording(u"שלב: "_s, u"Step: "_s));
+    renderBindings();
+    render();
+    m_sinceRender.start();
+}
+
+void PageView::detach() {
+    m_detached = true;
+    m_soon.stop();
+    disconnect(&m_page, &Page::changed, this, nullptr);
+}
+
+const PageView::Control* PageView::control(const QString& name) const {
+    const auto at =
+        std::find_if(m_controls.begin(), m_controls.end(), [&](const Control& c) { return c.name == name; });
+    return at == m_controls.end() ? nullptr : &*at;
+}
+
+void PageView::renderBindings() {
+    for (const Control& control : m_controls) {
+        QWidget* widget = control.widget;
+        if (!widget)
+            continue;
+        if (control.list) {
+            if (auto* list = qobject_cast<QListWidget*>(widget))
+                fillList(*list, *control.list, control.row);
+            else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
+                fillCombo(*box, *control.list, *control.caption);
+            else if (auto* cards = qobject_cast<ChoiceCards*>(widget))
+                cards->display(*control.list);
+        }
+        if (!control.caption)
+            continue;
+        const Caption& caption = *control.caption;
+        // A checkable button is bound to nothing but a CheckCaption.
+        if (auto* check = qobject_cast<QAbstractButton*>(widget); check && check->isCheckable()) {
+            const QSignalBlocker quiet(check);
+            check->setChecked(static_cast<const CheckCaption&>(caption).checked);
+        }
+        if (auto* edit = qobject_cast<QLineEdit*>(widget)) {
+            const bool leftwards = edit->layoutDirection() == Qt::RightToLeft;
+            edit->setAlignment(Qt::AlignAbsolute | Qt::AlignVCenter | (leftwards ? Qt::AlignRight : Qt::AlignLeft));
+            if (edit->text() != caption.text) {
+                const QSignalBlocker quiet(edit);
+                edit->setText(caption.text);
+            }
+        } else if (auto* button = qobject_cast<QAbstractButton*>(widget)) {
+            QString text = shownOnButton(caption.text);
+            if (!button->icon().isNull() && !text.isEmpty()) // some air between the sign and the word
+                text = QChar(0xA0) + text + QChar(0xA0);
+            if (button->text() != text)
+                button->setText(text);
+            if (!button->property("spoken").toBool())
+                button->setAccessibleName(caption.text.simplified());
+        } else if (auto* label = qobject_cast<QLabel*>(widget)) {
+            const QString text = isolated(caption.text);
+            if (label->text() != text)
+                label->setText(text);
+        }
+        // A label without a word takes no room.
+        const bool seen = caption.visible && !(qobject_cast<QLabel*>(widget) && caption.text.isEmpty());
+        if (widget->isHidden() == seen)
+            widget->setVisible(seen);
+        if (widget->isEnabledTo(widget->parentWidget()) != caption.enabled)
+            widget->setEnabled(caption.enabled);
+        if (widget->toolTip() != caption.hint)
+            widget->setToolTip(caption.hint);
+    }
+}
+
+void PageView::keyPressEvent(QKeyEvent* event) {
+    QWidget* focus = QApplication::focusWidget();
+    if (pressByEnter(*event, focus))
+        return;
+    if ((event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && qobject_cast<QLineEdit*>(focus)) {
+        for (const Control& control : m_controls) {
+            auto* main = qobject_cast<QPushButton*>(control.widget);
+            if (main && main->property("role") == u"main"_s && main->isVisible() && main->isEnabled()) {
+                main->click();
+                return;
+            }
+        }
+    }
+    if (event->key() == Qt::Key_Escape)
+        escape();
+    else
+        QWidget::keyPressEvent(event);
+}
+
+QPushButton* PageView::button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
+                              const QString& icon) {
+    auto* made = new QPushButton(this);
+    static constexpr const char* roles[] = {"main", "secondary", "plain", "quiet", "danger"};
+    setRole(made, roles[static_cast<int>(role)]);
+    made->setFocusPolicy(Qt::TabFocus);
+    if (!icon.isEmpty())
+        setIcon(made, icon,
+                role == Role::Main     ? QColor(Qt::white)
+                : role == Role::Danger ? Theme::Colour::Danger
+                                       : Theme::Colour::Ink);
+    connect(made, &QPushButton::clicked, this, [clicked = std::move(clicked)] { clicked(); });
+    bind(name, made, caption);
+    return made;
+}
+
+QLabel* PageView::label(const QString& name, const Caption& caption, const char* type) {
+    QLabel* made = makeLabel(this, type);
+    bind(name, made, caption);
+    return made;
+}
+
+QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited) {
+    auto* made = new QLineEdit(this);
+    made->setProperty("ownRing", true); // its border tells
+    connect(made, &QLineEdit::textEdited, this, [edited = std::move(edited)](const QString& text) { edited(text); });
+    bind(name, made, caption);
+    return made;
+}
+
+QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked) {
+    auto* made = new QCheckBox(this);
+    made->setFocusPolicy(Qt::TabFocus);
+    connect(made, &QCheckBox::clicked, this, [this, clicked = std::move(clicked)](bool on) {
+        clicked(on);
+        schedule();
+    });
+    bind(name, made, caption);
+    return made;
+}
+
+QComboBox* PageView::comboBox(const QString& name, const TextList& list, const Caption& caption,
+                              std::function<void(int)> activated) {
+    auto* made = new QComboBox(this);
+    made->setProperty("ownRing", true);
+    connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
+    bind(name, made, caption);
+    m_controls.back().list = &list;
+    return made;
+}
+
+ChoiceCards* PageView::choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+                                   std::function<CardButton*(int)> maker, std::function<void(int)> activated) {
+    auto* made = new ChoiceCards(m_theme, this, columns, std::move(maker));
+    connect(made, &ChoiceCards::activated, this, [this, activated = std::move(activated)](int row) {
+        activated(row);
+        schedule(); // the press has turned the mark over by itself; the page's word counts
+    });
+    bind(name, made, caption);
+    m_controls.back().list = &list;
+    return made;
+}
+
+void PageView::bind(const QString& name, QWidget* widget, const Caption& caption) {
+    widget->setObjectName(name);
+    m_controls.push_back({name, widget, &caption, nullptr, {}});
+}
+
+void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
+                          std::function<void()> clicked) {
+    button->setCheckable(true);
+    connect(button, &QAbstractButton::clicked, this, [this, clicked = std::move(clicked)] {
+        clicked();
+        schedule(); // the press has turned the mark over by itself; the page's word counts
+    });
+    bind(name, button, caption);
+}
+
+void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text) {
+    widget->setObjectName(name);
+    m_controls.push_back({name, widget, nullptr, nullptr, std::move(text)});
+}
+
+void PageView::bindHidden(const QString& name, const Caption& caption) {
+    m_controls.push_back({name, nullptr, &caption, nullptr, {}});
+}
+
+void PageView::bindList(const QString& name, const TextList& list, QWidget* widget,
+                        std::function<QString(const QString&)> row) {
+    if (widget)
+        widget->setObjectName(name);
+    m_controls.push_back({name, widget, nullptr, &list, {}, std::move(row)});
+}
+
+void PageView::setDirectedIcon(QPushButton* button, Way way) {
+    const bool right = (way == Way::Forwards) != (layoutDirection() == Qt::RightToLeft);
+    const QString icon = right ? u"arrow-right"_s : u"arrow-left"_s;
+    if (button->property("directedIcon") == icon)
+        return; // a button that is given its icon again paints itself again
+    button->setProperty("directedIcon", icon);
+    setIcon(button, icon, button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
+}
+
+void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour) {
+    const int size = m_theme.px(24);
+    button->setIcon(m_theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
+    button->setIconSize({size, size});
+}
+
+void PageView::speak(QWidget* widget, const QString& text) const {
+    widget->setProperty("spoken", true);
+    widget->setAccessibleName(text);
+}
+
+} // namespace lumora

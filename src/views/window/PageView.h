@@ -1,0 +1,127 @@
+#pragma once
+
+#include "session/Caption.h"
+#include "session/Page.h"
+#include "session/SessionState.h"
+#include "session/TextList.h"
+#include "views/kit/PageFrame.h"
+#include "views/kit/Theme.h"
+
+#include <QElapsedTimer>
+#include <QPointer>
+#include <QTimer>
+#include <QWidget>
+
+#include <functional>
+#include <vector>
+
+class QAbstractButton;
+class QCheckBox;
+class QComboBox;
+class QLineEdit;
+class QPushButton;
+
+namespace lumora {
+
+class CardButton;
+class ChoiceCards;
+class Overlay;
+
+// The base of all views. A control is bound to the page's state under its design name: text, visible, enabled and hint
+// follow the Caption at each rendering, and what the customer does calls the page's handler. render() sets what is more
+// than that.
+class PageView : public QWidget {
+    Q_OBJECT
+public:
+    PageView(Page& page, const SessionState& state, const Theme& theme);
+
+    const Page& page() const { return m_page; }
+
+    // One control of the page, seen or not.
+    struct Control {
+        QString name;
+        QPointer<QWidget> widget;         // null for what the page holds and nobody sees
+        const Caption* caption = nullptr; // one of the two tells what the control says
+        const TextList* list = nullptr;
+        std::function<QString()> text;                   // in place of the caption's
+        std::function<QString(const QString&)> row = {}; // what a person reads of a row of the list
+    };
+    const Control* control(const QString& name) const;
+
+    // Renders now if something has changed since the last time.
+    void renderNow();
+    // The page is gone or about to go: nothing of it is read from here on.
+    void detach();
+    bool isDetached() const { return m_detached; }
+    // A panel is docked at the bottom of the window, as high as it wishes, over the view of the page shown before it,
+    // which stays in sight and answers wherever it is not covered. A panel shows its content alone: no header, no bars.
+    virtual bool isPanel() const { return false; }
+    // So many pixels of this view's lower part lie behind a panel; 0 when the panel has gone.
+    virtual void setCoveredHeight(int) {}
+    // Esc on the page itself.
+    virtual void escape() {}
+    // What has the keyboard when the page comes to the front.
+    virtual QWidget* firstFocus() const { return nullptr; }
+
+protected:
+    enum class Role { Main, Secondary, Plain, Quiet, Danger };
+
+    // To be called at the end of the constructor of each view.
+    void start();
+    virtual void render() = 0;
+
+    const Theme& theme() const { return m_theme; }
+    const SessionState& state() const { return m_state; }
+    QString wording(const QString& hebrew, const QString& english) const { return m_state.wording(hebrew, english); }
+    PageFrame& frame() const { return *m_frame; }
+    void keyPressEvent(QKeyEvent* event) override;
+
+    // Makers of bound controls. The parent comes with the layout that they are added to.
+    QPushButton* button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
+                        const QString& icon = {});
+    QLabel* label(const QString& name, const Caption& caption, const char* type = "body");
+    QLineEdit* field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited);
+    QCheckBox* checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked);
+    // Rows from the list; what the box says from the caption, which may be a text that is no row.
+    QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption,
+                        std::function<void(int)> activated);
+
+    // The same as large cards, of which all rows are in sight.
+    ChoiceCards* choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+                             std::function<CardButton*(int)> maker, std::function<void(int)> activated);
+
+    // Binds a widget of the view's own making.
+    void bind(const QString& name, QWidget* widget, const Caption& caption);
+    // A button of the view's own making that can be chosen.
+    void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
+                    std::function<void()> clicked);
+    void bind(const QString& name, QWidget* widget, std::function<QString()> text);
+    // What has a name and is not seen.
+    void bindHidden(const QString& name, const Caption& caption);
+    void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr,
+                  std::function<QString(const QString&)> row = {});
+    // The icon of a button that points along the reading direction or against it.
+    enum class Way { Back, Forwards };
+    void setDirectedIcon(QPushButton* button, Way way);
+
+    void setIcon(QAbstractButton* button, const QString& icon, QColor colour);
+
+    // A spoken meaning for a control whose text does not tell enough.
+    void speak(QWidget* widget, const QString& text) const;
+
+private:
+    void schedule();
+    void renderBindings();
+
+    Page& m_page;
+    const SessionState& m_state;
+    const Theme& m_theme;
+    PageFrame* m_frame = nullptr;
+    std::vector<Control> m_controls;
+    QTimer m_soon;
+    QElapsedTimer m_sinceRender;
+    bool m_dirty = true;
+    bool m_detached = false;
+};
+
+} // namespace lumora

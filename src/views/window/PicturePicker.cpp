@@ -1,0 +1,410 @@
+#include "views/window/PicturePicker.h"
+
+#include "common/AnsiCodePage.h"
+#include "imaging/files/PictureFile.h"
+#include "platform/files/Drives.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "views/kit/PageFrame.h"
+
+#include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QPushButton>
+#include <QStandardPaths>
+#include <QStyledItemDelegate>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+enum ItemRole { PathRole = Qt::UserRole, FolderRole, PictureRole, PlainRole, BrokenRole };
+
+// One cell of the grid: the picture or the folder's sign, and the name below it.
+class CellPainter : public QStyledItemDelegate {
+public:
+    CellPainter(const Theme& theme, QObject* parent)
+        : QStyledItemDelegate(parent)
+        , m_theme(theme) {}
+
+    QSize sizeHint(const QStyleOptionViewItem&, const QModelIndex&) const override {
+        return {m_theme.px(166), m_theme.px(172)};
+    }
+
+    void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
+        painter->save();
+        painter->setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
+        const QRectF cell = QRectF(option.rect).adjusted(m_theme.px(6), m_theme.px(6), -m_theme.px(6), -m_theme.px(6));
+        const bool chosen = option.state & QStyle::State_Selected;
+        const bool focused = option.state & QStyle::State_HasFocus;
+        painter->setPen(QPen(chosen ? Theme::Colour::Primary : Theme::Colour::Line, chosen ? m_theme.px(3) : 1));
+        painter->setBrush(chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface);
+        painter->drawRoundedRect(cell, m_theme.corner(), m_theme.corner());
+        if (focused && !chosen) {
+            painter->setPen(QPen(Theme::Colour::Focus, m_theme.px(3)));
+            painter->setBrush(Qt::NoBrush);
+            painter->drawRoundedRect(cell, m_theme.corner(), m_theme.corner());
+        }
+        const QRectF box = cell.adjusted(m_theme.px(10), m_theme.px(10), -m_theme.px(10), -m_theme.px(36));
+        const QImage picture = index.data(PictureRole).value<QImage>();
+        if (!picture.isNull()) {
+            const QSizeF fit = QSizeF(picture.size()).scaled(box.size(), Qt::KeepAspectRatio);
+            QRectF at(QPointF(), fit);
+            at.moveCenter(box.center());
+            painter->drawImage(at, picture);
+        } else {
+            const bool folder = index.data(FolderRole).toBool();
+            const int size = m_theme.px(folder ? 68 : 44);
+            const QString icon = folder                            ? u"folder"_s
+                                 : index.data(PlainRole).toBool()  ? u"document"_s
+                                 : index.data(BrokenRole).toBool() ? u"warning"_s
+                                                                   : u"picture"_s;
+            painter->drawPixmap(QPointF(box.center().x() - size / 2.0, box.center().y() - size / 2.0),
+                                m_theme.icon(icon, size, folder ? Theme::Colour::Primary : Theme::Colour::Muted));
+        }
+        painter->setFont(m_theme.font(Theme::Type::Small));
+        painter->setPen(Theme::Colour::Ink);
+        const QRectF line(cell.left() + m_theme.px(8), cell.bottom() - m_theme.px(32), cell.width() - m_theme.px(16),
+                          m_theme.px(26));
+        const QString name = painter->fontMetrics().elidedText(index.data(Qt::DisplayRole).toString(), Qt::ElideMiddle,
+                                                               static_cast<int>(line.width()));
+        painter->drawText(line, Qt::AlignCenter, name);
+        painter->restore();
+    }
+
+private:
+    const Theme& m_theme;
+};
+
+// Enter takes what is chosen, Backspace goes up.
+class Grid : public QListWidget {
+public:
+    using QListWidget::QListWidget;
+    std::function<void()> up;
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override {
+        if (event->key() == Qt::Key_Backspace)
+            up();
+        else if ((event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && currentItem())
+            Q_EMIT itemActivated(currentItem());
+        else if (event->key() == Qt::Key_Escape)
+            event->ignore();
+        else
+            QListWidget::keyPressEvent(event);
+    }
+
+    // The first click of the two may have opened a folder; the second is not meant for what lies there now.
+    void mouseDoubleClickEvent(QMouseEvent* event) override {
+        const QListWidgetItem* item = itemAt(event->position().toPoint());
+        if (item && item->isSelected())
+            QListWidget::mouseDoubleClickEvent(event);
+    }
+};
+
+QString nameOf(const HostPath& path) {
+    return toText(path.filename());
+}
+
+bool isJpeg(const HostPath& path) {
+    return toText(path.extension()).compare(u".jpg", Qt::CaseInsensitive) == 0;
+}
+
+// A picture whose last folder is remembered for the next pick of the same run would be another customer's business: the
+// picker opens at the first place that holds anything.
+bool holdsAnything(const HostPath& folder) {
+    std::error_code error;
+    std::filesystem::directory_iterator at(folder, std::filesystem::directory_options::skip_permission_denied, error);
+    return !error && at != std::filesystem::directory_iterator();
+}
+
+} // namespace
+
+PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
+                             const QString& prompt, const QString& initialFolder, const QString& title,
+                             Dialogs::Offer offer)
+    : Overlay(theme, parent)
+    , m_theme(theme)
+    , m_state(state)
+    , m_files(files)
+    , m_offer(offer) {
+    setObjectName(u"picturePicker"_s);
+    setAccessibleName(title.isEmpty() ? prompt : title);
+    setFilling();
+
+    auto* head = makeLabel(this, "title");
+    head->setText(isolated(prompt.trimmed()));
+    head->setObjectName(u"pickerPrompt"_s);
+    column()->addWidget(head);
+    auto* guide = makeLabel(this, "muted");
+    guide->setText(isolated(
+        everyFile()
+            ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
+            : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                            u"Select only one image of a folder and the program will show you all the images"_s)));
+    guide->setObjectName(u"pickerGuide"_s);
+    column()->addWidget(guide);
+
+    auto* middle = new QHBoxLayout;
+    middle->setSpacing(theme.wideGap());
+    auto* side = new QVBoxLayout;
+    side->setSpacing(theme.px(8));
+    auto* sideTitle = makeLabel(this, "smallMuted");
+    sideTitle->setText(everyFile() ? state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
+                                   : state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s));
+    side->addWidget(sideTitle);
+    m_places = places(initialFolder);
+    for (std::size_t i = 0; i < m_places.size(); ++i) {
+        const Place& place = m_places[i];
+        auto* button = new QPushButton(
+            theme.buttonIcon(place.icon, theme.px(24), Theme::Colour::Primary, Theme::Colour::Muted), QString(), this);
+        button->setIconSize({theme.px(24), theme.px(24)});
+        button->setText(
+            QChar(0xA0) +
+            button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, theme.px(130)).replace(u'&', u"&&"_s));
+        button->setToolTip(toText(place.folder));
+        button->setAccessibleName(place.name);
+        button->setObjectName(u"place(%1)"_s.arg(i));
+        button->setCheckable(true);
+        button->setFocusPolicy(Qt::TabFocus);
+        button->setFixedWidth(theme.px(210));
+        connect(button, &QPushButton::clicked, this, [this, i] { open(m_places[i].folder); });
+        m_placeButtons.push_back(button);
+        side->addWidget(button);
+    }
+    side->addStretch(1);
+    middle->addLayout(side);
+
+    auto* main = new QVBoxLayout;
+    main->setSpacing(theme.px(8));
+    auto* path = new QHBoxLayout;
+    m_up = new QPushButton(theme.buttonIcon(u"folder-up"_s, theme.px(24), Theme::Colour::Ink, Theme::Colour::Muted),
+                           state.wording(u"תיקייה מעל"_s, u"Folder above"_s), this);
+    m_up->setIconSize({theme.px(24), theme.px(24)});
+    m_up->setObjectName(u"pickerUp"_s);
+    m_up->setAccessibleName(m_up->text());
+    m_up->setFocusPolicy(Qt::TabFocus);
+    connect(m_up, &QPushButton::clicked, this, [this] { open(m_folder.parent_path()); });
+    path->addWidget(m_up);
+    m_where = makeLabel(this, "strong");
+    m_where->setWordWrap(false);
+    path->addWidget(m_where, 1);
+    main->addLayout(path);
+
+    auto* grid = new Grid(this);
+    grid->up = [this] { m_up->click(); };
+    m_grid = grid;
+    m_grid->setObjectName(u"pickerGrid"_s);
+    m_grid->setAccessibleName(everyFile() ? state.wording(u"תיקיות וקבצים"_s, u"Folders and files"_s)
+                                          : state.wording(u"תיקיות ותמונות"_s, u"Folders and pictures"_s));
+    m_grid->setItemDelegate(new CellPainter(theme, m_grid));
+    m_grid->setViewMode(QListView::IconMode);
+    m_grid->setMovement(QListView::Static);
+    m_grid->setResizeMode(QListView::Adjust);
+    m_grid->setUniformItemSizes(true);
+    m_grid->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
+    m_grid->setProperty("ownRing", true);
+    connect(m_grid, &QListWidget::itemDoubleClicked, this, &PicturePicker::activate);
+    connect(m_grid, &QListWidget::itemActivated, this, &PicturePicker::activate);
+    connect(m_grid, &QListWidget::itemClicked, this, [this](const QListWidgetItem* item) {
+        if (item->data(FolderRole).toBool())
+            activate(item); // one touch opens a folder
+    });
+    connect(m_grid, &QListWidget::itemSelectionChanged, this, [this] {
+        const QListWidgetItem* item = m_grid->currentItem();
+        m_take->setEnabled(item && item->isSelected() && !item->data(FolderRole).toBool());
+    });
+    main->addWidget(m_grid, 1);
+    m_empty = makeLabel(m_grid, "muted");
+    m_empty->setAlignment(Qt::AlignCenter);
+    auto* over = new QVBoxLayout(m_grid);
+    over->addWidget(m_empty);
+    m_empty->setAttribute(Qt::WA_TransparentForMouseEvents);
+    middle->addLayout(main, 1);
+    column()->addLayout(middle, 1);
+
+    auto* bottom = new QHBoxLayout;
+    auto* cancel = new QPushButton(state.wording(u"ביטול"_s, u"Cancel"_s), this);
+    setRole(cancel, "secondary");
+    cancel->setObjectName(u"pickerCancel"_s);
+    cancel->setAccessibleName(cancel->text());
+    cancel->setFocusPolicy(Qt::TabFocus);
+    connect(cancel, &QPushButton::clicked, this, [this] { Q_EMIT finished({}); });
+    bottom->addWidget(cancel);
+    bottom->addStretch(1);
+    m_take = new QPushButton(everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
+                                         : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
+                             this);
+    setRole(m_take, "main");
+    m_take->setObjectName(u"pickerTake"_s);
+    m_take->setAccessibleName(m_take->text());
+    m_take->setFocusPolicy(Qt::TabFocus);
+    connect(m_take, &QPushButton::clicked, this, &PicturePicker::take);
+    bottom->addWidget(m_take);
+    column()->addLayout(bottom);
+
+    connect(this, &Overlay::escaped, this, [this] { Q_EMIT finished({}); });
+    m_reader.setInterval(0);
+    connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
+    setFirstFocus(m_grid);
+    std::error_code absent;
+    if (const auto initial = m_files.drives().toHost(initialFolder);
+        everyFile() && initial && std::filesystem::is_directory(*initial, absent)) {
+        open(*initial);
+        return;
+    }
+    const auto first =
+        std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
+    open(first != m_places.end() ? first->folder : m_places.front().folder);
+}
+
+std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFolder) const {
+    std::vector<Place> result;
+    const auto add = [&](const QString& name, const QString& icon, const HostPath& folder) {
+        std::error_code error;
+        const bool known =
+            std::any_of(result.begin(), result.end(), [&](const Place& place) { return place.folder == folder; });
+        if (!folder.empty() && !known && std::filesystem::is_directory(folder, error))
+            result.push_back({name, icon, folder});
+    };
+    const auto addDrive = [&](const Drives::Drive& drive) {
+        const QString name = drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : drive.name;
+        add(name, drive.removable ? u"card"_s : u"drive"_s, drive.folder);
+    };
+    const auto drives = m_files.drives().drives();
+    for (const Drives::Drive& drive : drives) {
+        if (drive.removable || drive.offeredFirst)
+            addDrive(drive);
+    }
+    const auto standard = [](QStandardPaths::StandardLocation where) {
+        return toHostPath(QStandardPaths::writableLocation(where));
+    };
+    add(m_state.wording(u"תמונות"_s, u"Pictures"_s), u"pictures"_s, standard(QStandardPaths::PicturesLocation));
+    add(m_state.wording(u"שולחן העבודה"_s, u"Desktop"_s), u"picture"_s, standard(QStandardPaths::DesktopLocation));
+    add(m_state.wording(u"הורדות"_s, u"Downloads"_s), u"folder"_s, standard(QStandardPaths::DownloadLocation));
+    add(m_state.wording(u"תיקיית הבית"_s, u"Home folder"_s), u"home"_s, standard(QStandardPaths::HomeLocation));
+    if (const auto initial = m_files.drives().toHost(initialFolder))
+        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : initialFolder.left(2),
+            everyFile() ? u"folder"_s : u"drive"_s, *initial);
+    for (const Drives::Drive& drive : drives)
+        addDrive(drive);
+    if (result.empty())
+        result.push_back({u"/"_s, u"drive"_s, "/"});
+    return result;
+}
+
+void PicturePicker::open(const HostPath& folder) {
+    m_folder = folder;
+    m_reader.stop();
+    m_unread.clear();
+    m_grid->clear();
+    m_take->setEnabled(false);
+    m_up->setEnabled(folder.has_relative_path());
+    std::size_t best = m_places.size();
+    for (std::size_t i = 0; i < m_places.size(); ++i) {
+        if (m_places[i].folder == folder)
+            best = i;
+        m_placeButtons[i]->setChecked(false);
+    }
+    if (best < m_places.size())
+        m_placeButtons[best]->setChecked(true);
+    m_where->setText(fromLeft(m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480))));
+    m_where->setToolTip(toText(folder));
+
+    std::vector<HostPath> folders;
+    std::vector<HostPath> files;
+    std::error_code error;
+    std::filesystem::directory_iterator at(folder, error);
+    for (; !error && at != std::filesystem::directory_iterator(); at.increment(error)) {
+        const HostPath& path = at->path();
+        if (nameOf(path).startsWith(u'.'))
+            continue;
+        std::error_code kind;
+        if (at->is_directory(kind))
+            folders.push_back(path);
+        else if ((everyFile() || isJpeg(path)) && at->is_regular_file(kind))
+            files.push_back(path);
+    }
+    const auto byName = [](const HostPath& a, const HostPath& b) {
+        return nameOf(a).compare(nameOf(b), Qt::CaseInsensitive) < 0;
+    };
+    std::sort(folders.begin(), folders.end(), byName);
+    std::sort(files.begin(), files.end(), byName);
+    const auto add = [&](const HostPath& path, bool isFolder) {
+        auto* item = new QListWidgetItem(nameOf(path), m_grid);
+        item->setData(PathRole, QByteArray::fromStdString(path.string()));
+        item->setData(FolderRole, isFolder);
+        item->setToolTip(nameOf(path));
+        item->setData(PlainRole, !isFolder && !isJpeg(path));
+        if (!isFolder && isJpeg(path))
+            m_unread.push_back(m_grid->row(item));
+    };
+    for (const HostPath& path : folders)
+        add(path, true);
+    for (const HostPath& path : files)
+        add(path, false);
+    m_empty->setVisible(m_grid->count() == 0);
+    m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
+                                             u"This folder can't be opened. Choose another place."_s)
+                     : everyFile() ? m_state.wording(u"אין כאן קבצים. בחר מקום אחר."_s,
+                                                     u"There are no files here. Choose another place."_s)
+                                   : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
+                                                     u"There are no pictures here. Choose another place."_s));
+    if (m_grid->count() > 0)
+        m_grid->setCurrentRow(0, QItemSelectionModel::NoUpdate);
+    if (!m_unread.empty())
+        m_reader.start();
+}
+
+void PicturePicker::readNext() {
+    if (m_unread.empty()) {
+        m_reader.stop();
+        return;
+    }
+    // What is in view comes first.
+    auto next = m_unread.begin();
+    const QRect seen = m_grid->viewport()->rect();
+    for (auto at = m_unread.begin(); at != m_unread.end(); ++at) {
+        const QRect cell = m_grid->visualItemRect(m_grid->item(*at));
+        if (cell.intersects(seen)) {
+            next = at;
+            break;
+        }
+        if (cell.top() > seen.bottom())
+            break;
+    }
+    QListWidgetItem* item = m_grid->item(*next);
+    m_unread.erase(next);
+    const HostPath path(item->data(PathRole).toByteArray().toStdString());
+    const int side = m_theme.px(150);
+    if (const auto size = readPictureSize(path)) {
+        const QSize fit = QSize(size->width, size->height).scaled(side, side, Qt::KeepAspectRatio).expandedTo({1, 1});
+        if (const auto picture = loadPictureScaled(path, {fit.width(), fit.height()})) {
+            item->setData(PictureRole, picture->image());
+            return;
+        }
+    }
+    item->setData(BrokenRole, true);
+}
+
+void PicturePicker::activate(const QListWidgetItem* item) {
+    const HostPath path(item->data(PathRole).toByteArray().toStdString());
+    if (item->data(FolderRole).toBool())
+        open(path);
+    else
+        Q_EMIT finished(AnsiCodePage::squeeze(m_files.drives().toDrive(path)));
+}
+
+void PicturePicker::take() {
+    if (const QListWidgetItem* item = m_grid->currentItem())
+        activate(item);
+}
+
+} // namespace lumora

@@ -1,0 +1,67 @@
+#pragma once
+
+#include "platform/Dialogs.h"
+#include "platform/files/HostPath.h"
+#include "views/kit/Overlay.h"
+
+#include <QImage>
+#include <QListWidget>
+#include <QTimer>
+
+#include <deque>
+#include <vector>
+
+class QLabel;
+class QPushButton;
+class QVBoxLayout;
+
+namespace lumora {
+
+class Files;
+struct SessionState;
+
+// The picker of one picture: the places at the side, memory cards first, and a grid of the folders and JPEG files of
+// the place that is open. A click chooses, a double click or Enter takes it. Small pictures are read one after another
+// once the grid stands, those in view first, so that a folder of thousands opens at once. Where every file is on offer,
+// other files show by a sign.
+class PicturePicker : public Overlay {
+    Q_OBJECT
+public:
+    // initialFolder is a drive path; the picker opens there when no better place is known.
+    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
+                  const QString& prompt, const QString& initialFolder, const QString& title, Dialogs::Offer offer);
+
+Q_SIGNALS:
+    // The drive path of the picture as the code page has it ("?" for what it lacks); empty for a cancel.
+    void finished(const QString& drivePath);
+
+private:
+    struct Place {
+        QString name;
+        QString icon;
+        HostPath folder;
+    };
+    bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
+    std::vector<Place> places(const QString& initialFolder) const;
+    void open(const HostPath& folder);
+    void activate(const QListWidgetItem* item);
+    void take();
+    void readNext();
+
+    const Theme& m_theme;
+    const SessionState& m_state;
+    const Files& m_files;
+    const Dialogs::Offer m_offer;
+    std::vector<Place> m_places;
+    std::vector<QPushButton*> m_placeButtons;
+    HostPath m_folder;
+    QLabel* m_where;
+    QLabel* m_empty;
+    QPushButton* m_up;
+    QPushButton* m_take;
+    QListWidget* m_grid;
+    QTimer m_reader;
+    std::deque<int> m_unread; // rows whose small picture is still to be read
+};
+
+} // namespace lumora

@@ -1,0 +1,106 @@
+#include "views/window/ScreenDialogs.h"
+
+#include "session/SessionState.h"
+#include "views/window/MainWindow.h"
+#include "views/window/MessagePanel.h"
+#include "views/window/PicturePicker.h"
+
+#include <QEventLoop>
+
+namespace lumora {
+
+ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files)
+    : m_window(window)
+    , m_state(state)
+    , m_files(files) {}
+
+ScreenDialogs::~ScreenDialogs() = default;
+
+void ScreenDialogs::message(const QString& text, const QString& title) {
+    shownTexts += text;
+    m_waiting.append({text, title});
+    if (!m_panel)
+        showNext();
+}
+
+void ScreenDialogs::showNext() {
+    if (m_waiting.isEmpty())
+        return;
+    const Box& box = m_waiting.first();
+    m_panel = new MessagePanel(m_window.theme(), &m_window, MessagePanel::Kind::Message, box.title, box.text,
+                               {closingText()});
+    m_panel->setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    connect(m_panel, &MessagePanel::answered, this, [this, panel = m_panel] {
+        if (m_panel != panel)
+            return;
+        panel->setOpen(false);
+        panel->deleteLater();
+        m_panel = nullptr;
+        m_waiting.removeFirst();
+        showNext();
+    });
+    m_panel->setOpen(true);
+}
+
+QString ScreenDialogs::closingText() const {
+    return m_state.wording(QStringLiteral("הבנתי"), QStringLiteral("OK"));
+}
+
+QString ScreenDialogs::frontText() const {
+    return m_waiting.isEmpty() ? QString() : m_waiting.first().text;
+}
+
+void ScreenDialogs::closeMessages() {
+    m_waiting.clear();
+    if (m_panel) {
+        m_panel->setOpen(false);
+        m_panel->deleteLater();
+        m_panel = nullptr;
+    }
+}
+
+bool ScreenDialogs::ask(const QString& question, const QString& title) {
+    shownTexts += question;
+    if (nextAnswer) {
+        if (const std::optional<bool> answer = nextAnswer())
+            return *answer;
+    }
+    MessagePanel panel(m_window.theme(), &m_window, MessagePanel::Kind::Question, title, question,
+                       {m_state.wording(QStringLiteral("כן"), QStringLiteral("Yes")),
+                        m_state.wording(QStringLiteral("לא"), QStringLiteral("No"))});
+    panel.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    QEventLoop loop;
+    bool yes = false;
+    connect(&panel, &MessagePanel::answered, &loop, [&](bool answer) {
+        yes = answer;
+        loop.quit();
+    });
+    panel.setOpen(true);
+    loop.exec();
+    panel.setOpen(false);
+    return yes;
+}
+
+QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
+                                Offer offer) {
+    if (beforePick)
+        beforePick();
+    if (nextPick) {
+        if (const std::optional<QString> pick = nextPick())
+            return *pick;
+    }
+    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, prompt, initialFolder, title, offer);
+    picker.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    QEventLoop loop;
+    QString chosen;
+    connect(&picker, &PicturePicker::finished, &loop, [&](const QString& path) {
+        chosen = path;
+        loop.quit();
+    });
+    picker.setOpen(true);
+    loop.exec();
+    picker.setOpen(false);
+    return chosen;
+}
+
+} // namespace lumora

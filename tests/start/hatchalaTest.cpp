@@ -1,0 +1,252 @@
+#include "start/hatchala.h"
+
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+// Gives what a settings host would: the bytes of one file, or nothing.
+class SettingsSite : public NoInternet {
+public:
+    Result<void> download(const QString& url, const HostPath& target) override {
+        urls += url;
+        if (answer.isEmpty())
+            return Failure{Failure::Kind::NotFound, u"404"_s};
+        QFile file(toText(target));
+        if (!file.open(QIODevice::WriteOnly) || file.write(answer) != answer.size())
+            return Failure{Failure::Kind::Other, file.errorString()};
+        return {};
+    }
+    QStringList urls;
+    QByteArray answer;
+};
+
+class hatchalaTest : public ::testing::Test {
+protected:
+    hatchalaTest() {
+        deployment.profile.Shops = {Shop{u"Haifa"_s, u"04-1"_s}, Shop{u"Yaffo"_s, u"03-2"_s}};
+        chain.registerPage(PageId::hatchala,
+                           [this] { return std::make_unique<hatchala>(state, machine.platform, chain, deployment); });
+        chain.registerPage(PageId::nnn, [] { return std::make_unique<Page>(PageId::nnn); });
+    }
+    hatchala& start() {
+        chain.show(PageId::hatchala);
+        return static_cast<hatchala&>(*chain.front());
+    }
+
+    SettingsSite site;
+    TestPlatform machine{site};
+    SessionState state;
+    Deployment deployment;
+    PageChain chain{machine.pump};
+};
+
+TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
+    state.EnglishTips = 1;
+    deployment.SugTzad = 60;
+    deployment.profile.LabPhone = u"09-9"_s;
+    state.handOver.notice = u"order 104 stays here"_s;
+    hatchala& page = start();
+    EXPECT_EQ(state.EnglishTips, 0);
+    EXPECT_EQ(state.SugTzad, 60);
+    EXPECT_EQ(state.DiskRoot, u"C:\\");
+    EXPECT_EQ(state.profile.AdUrl1, u"http://www.lumora.example//ad01.jpg");
+    EXPECT_EQ(state.profile.AdFile2, u"C:\\lumora\\zmany\\ad02.jpg");
+    EXPECT_EQ(page.List1.items(), QStringList({"* Haifa", "* Yaffo"}));
+    for (const Caption* label : {&page.Label4Tel, &page.Label4Tel2, &page.Label4Zel})
+        EXPECT_EQ(label->text, u"09-9");
+    EXPECT_EQ(page.Notice.text, u"order 104 stays here");
+    EXPECT_TRUE(page.Notice.visible);
+    EXPECT_TRUE(state.handOver.notice.isEmpty()) << "the line is for one customer";
+    EXPECT_TRUE(page.Timer2.running() && page.Timer5.running());
+    EXPECT_FALSE(page.Timer1.running() || page.Timer3.running() || page.Timer4.running());
+}
+
+TEST_F(hatchalaTest, SwitchesItsWordingAndKeepsTwoRows) {
+    hatchala& page = start();
+    page.Check1_Click(true);
+    page.Check1_Click(true);
+    EXPECT_EQ(page.List1.items(), QStringList({"* Recieve by Postmail ", "* Get at stor "}));
+    EXPECT_EQ(page.Image1.hint, u"Start Button");
+    EXPECT_TRUE(page.Label3.visible);
+    page.Check1_Click(false);
+    page.Check1_Click(false);
+    EXPECT_EQ(page.List1.count(), 2);
+    EXPECT_TRUE(page.Image1.hint.isEmpty());
+    EXPECT_FALSE(page.Label4.visible);
+}
+
+TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
+    hatchala& page = start();
+    page.Check1_Click(true);
+    state.MishloachHabaita = true;
+    state.shemot.Mail = u"earlier@example.com"_s;
+    state.profile.FtpServer = u"changed in the panel"_s;
+    page.Image1_MouseDown();
+    page.Image1_MouseDown();
+    page.Image1_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::nnn);
+    EXPECT_EQ(chain.find(PageId::hatchala), nullptr);
+    EXPECT_EQ(state.KodMishloach, u"KUP");
+    EXPECT_EQ(state.KodMishloachMakor, u"KUP");
+    EXPECT_FALSE(state.MishloachHabaita);
+    EXPECT_TRUE(state.shemot.Mail.isEmpty());
+    EXPECT_EQ(state.profile.FtpServer, u"192.0.2.10");
+    EXPECT_EQ(state.EnglishTips, 1) << "only the next load of this page clears it";
+    EXPECT_FALSE(page.Timer2.running() || page.Timer5.running());
+}
+
+TEST_F(hatchalaTest, TheCountdownStartsByItself) {
+    hatchala& page = start();
+    for (int second = 0; second < 5; ++second)
+        page.Timer4_Tick();
+    EXPECT_EQ(page.Label6.text, u"0");
+    EXPECT_EQ(chain.front(), &page);
+    page.Timer4_Tick();
+    EXPECT_EQ(chain.front()->id(), PageId::nnn);
+    EXPECT_EQ(state.KodMishloach, u"PIC");
+}
+
+TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
+    deployment.DeliveryChoiceMode = 1;
+    deployment.profile.LabPhone = u"09-9"_s;
+    QString seenByTheDetails;
+    chain.registerPage(PageId::nnn, [&] {
+        seenByTheDetails = state.profile.LabPhone;
+        return std::make_unique<Page>(PageId::nnn);
+    });
+    const struct {
+        int row;
+        QString code;
+        QString phone;
+        QString seen; // the first shop's number comes behind the hand-over
+    } cases[] = {{0, "SOK", "04-1", "09-9"}, {1, "OSK", "03-2", "03-2"}};
+    for (const auto& c : cases) {
+        hatchala& page = start();
+        page.Image1_MouseDown();
+        ASSERT_EQ(chain.front(), &page);
+        page.Image1_Click();
+        EXPECT_TRUE(page.Picture1.visible && page.Timer3.running());
+        EXPECT_FALSE(page.Timer5.running());
+        EXPECT_EQ(state.KodMishloach, u"KUP");
+        for (int tick = 0; tick < 100; ++tick)
+            page.Timer3_Tick();
+        EXPECT_EQ(page.Picture1Width, 230);
+        EXPECT_FALSE(page.Timer3.running());
+        state.MishloachHabaita = true;
+        state.shemot.Mail = u"earlier@example.com"_s;
+        page.List1_Click(c.row);
+        ASSERT_EQ(chain.front()->id(), PageId::nnn);
+        EXPECT_EQ(state.KodMishloach, c.code);
+        EXPECT_EQ(state.KodMishloachMakor, c.code);
+        EXPECT_EQ(state.profile.LabPhone, c.phone);
+        EXPECT_EQ(seenByTheDetails, c.seen);
+        EXPECT_FALSE(state.MishloachHabaita);
+        EXPECT_TRUE(state.shemot.Mail.isEmpty());
+        chain.unload(PageId::nnn);
+    }
+}
+
+TEST_F(hatchalaTest, APressWithAShopChosenStartsWithTheShop) {
+    deployment.DeliveryChoiceMode = 1;
+    hatchala& page = start();
+    page.List1.setCurrentIndex(1);
+    page.Image1_MouseDown();
+    ASSERT_EQ(chain.front()->id(), PageId::nnn);
+    EXPECT_EQ(state.KodMishloach, u"OSK");
+    EXPECT_EQ(state.profile.LabPhone, u"03-2");
+}
+
+TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
+    hatchala& page = start();
+    state.profile.SiteUrl = u"changed"_s;
+    page.Image11_Click();
+    page.Image8_Click();
+    EXPECT_EQ(machine.shell.webPages,
+              QStringList({"http://www.lumora.example/album_pricelist", "http://www.lumora.example/"}));
+    page.Image3_MouseDown();
+    EXPECT_TRUE(chain.hasEnded());
+}
+
+TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
+    hatchala& page = start();
+    page.Timer2_Tick();
+    EXPECT_FALSE(page.Timer2.running()) << "no picture on the disk";
+    std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
+    site.answer = "picture";
+    page.Timer1_Tick();
+    EXPECT_EQ(site.urls, QStringList({"http://www.lumora.example//ad01.jpg"}));
+    EXPECT_EQ(page.Picture4, state.profile.AdFile1);
+    EXPECT_TRUE(page.Timer2.running());
+    page.Picture4Width = 100;
+    page.Timer2_Tick();
+    EXPECT_EQ(page.Timer2.interval(), 30);
+    EXPECT_EQ(page.Picture4Width, 100) << "it does not move before it was at a limit";
+    page.Picture4Width = 265;
+    page.Timer2_Tick();
+    EXPECT_EQ(page.Picture4Width, 264);
+    for (int tick = 0; tick < 260; ++tick)
+        page.Timer2_Tick();
+    EXPECT_EQ(page.Picture4Width, 4);
+    page.Timer2_Tick();
+    EXPECT_EQ(page.Picture4Width, 5);
+}
+
+TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade) {
+    hatchala& page = start();
+    site.answer = "picture";
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "a file in the way").ok());
+    page.Timer1_Tick();
+    EXPECT_EQ(page.Picture4, QString());
+    std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
+    ASSERT_TRUE(machine.files.writeWhole(state.profile.AdFile1, "picture").ok());
+    page.Timer1_Tick();
+    EXPECT_EQ(page.Picture4, state.profile.AdFile1);
+    EXPECT_EQ(site.urls, QStringList()) << "nothing is fetched then";
+}
+
+TEST_F(hatchalaTest, ThePageThatWaitsAsksForNoRendering) {
+    hatchala& page = start();
+    int renderings = 0;
+    QObject::connect(&page, &Page::changed, [&] { ++renderings; });
+    page.Timer2_Tick();
+    page.Label8Top = 430;
+    page.Timer5_Tick();
+    EXPECT_EQ(page.Label8Top, 401);
+    EXPECT_EQ(renderings, 0);
+}
+
+TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
+    hatchala& page = start();
+    page.DownloadSettings();
+    page.Command5_Click();
+    EXPECT_EQ(page.List4pices.count(), 21);
+    const QString path = u"C:\\2000lumora\\tarvelmond.txt"_s;
+    EXPECT_EQ(machine.files.read(path)->size(), 203);
+    const QString text = page.Label5.text;
+    page.Command4_Click();
+    EXPECT_NE(page.Label5.text, text);
+    page.Command6_Click();
+    EXPECT_EQ(page.Label5.text, text);
+
+    page.Command3_Click();
+    EXPECT_EQ(machine.dialogs.messages, QStringList({"No Server", "No Server 2"}));
+    EXPECT_FALSE(machine.files.fileExists(path)) << "the old copy goes before the fetch";
+
+    site.answer = "TK1=0^TK1=5^X=1^\r\nsecond\r\n";
+    page.Command3_Click();
+    EXPECT_EQ(machine.dialogs.messages.size(), 2);
+    EXPECT_EQ(site.urls.last(), u"http://settings.lumora.example/00natoonim/tarvelmond.txt");
+    EXPECT_EQ(page.List2.items(), QStringList({"TK1=0^TK1=5^X=1^", "second"}));
+    EXPECT_EQ(page.List4pices.items(), QStringList({"TK1=5", "X=1"}));
+    page.ReadSettingsFile(u"C:\\2000lumora\\other.txt"_s);
+    EXPECT_EQ(machine.dialogs.messages.last(), u"No Server");
+    EXPECT_TRUE(page.List2.isEmpty());
+}
+
+} // namespace
+} // namespace lumora

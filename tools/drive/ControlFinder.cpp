@@ -1,0 +1,344 @@
+#include "drive/ControlFinder.h"
+
+#include "session/PageChain.h"
+#include "views/kit/ChoiceCards.h"
+#include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QKeyEvent>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QMouseEvent>
+#include <QPlainTextEdit>
+
+#include <algorithm>
+#include <cmath>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+Failure fail(const QString& text) {
+    return {Failure::Kind::Other, text};
+}
+
+// A point of the widget that is really on the window, also when a scroll area cuts it.
+QPoint middleOf(const QWidget& widget) {
+    return widget.visibleRegion().boundingRect().center();
+}
+
+void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held,
+           Qt::MouseButton button = Qt::LeftButton) {
+    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), button, held,
+                      Qt::NoModifier);
+    QApplication::sendEvent(&widget, &event);
+}
+
+ControlFinder::Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) {
+    const QPointer<QWidget> alive(&widget);
+    // A mouse comes from somewhere: what follows it without a press has seen it before the press.
+    if (widget.hasMouseTracking())
+        mouse(widget, at, QEvent::MouseMove, Qt::NoButton, Qt::NoButton);
+    if (alive)
+        mouse(*alive, at, QEvent::MouseButtonPress, button, button);
+    return {alive, at, button};
+}
+
+void letMouseGo(const ControlFinder::Held& held) {
+    if (held.widget && held.widget->isVisible())
+        mouse(*held.widget, held.at, QEvent::MouseButtonRelease, Qt::NoButton, held.button);
+}
+
+void click(QWidget& widget, QPoint at) {
+    letMouseGo(pressDown(widget, at));
+}
+
+QPoint pointOf(const QWidget& widget, QPointF percent) {
+    return {std::clamp(static_cast<int>(std::lround(percent.x() / 100 * widget.width())), 0, widget.width() - 1),
+            std::clamp(static_cast<int>(std::lround(percent.y() / 100 * widget.height())), 0, widget.height() - 1)};
+}
+
+QString unusable(const QWidget& widget) {
+    if (!widget.isVisible() || widget.visibleRegion().isEmpty())
+        return u"hidden"_s;
+    return widget.isEnabled() ? QString() : u"disabled"_s;
+}
+
+QString coveredAt(const QWidget& widget, QPoint at) {
+    QWidget* hit = widget.window()->childAt(widget.mapTo(widget.window(), at));
+    if (hit == &widget || (hit && widget.isAncestorOf(hit)))
+        return {};
+    return hit ? u"covered by %1"_s.arg(hit->objectName().isEmpty()
+                                            ? QString::fromLatin1(hit->metaObject()->className())
+                                            : hit->objectName())
+               : u"outside the window"_s;
+}
+
+void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers modifiers = Qt::NoModifier) {
+    QKeyEvent press(QEvent::KeyPress, code, modifiers, text);
+    QApplication::sendEvent(&widget, &press);
+    QKeyEvent release(QEvent::KeyRelease, code, modifiers, text);
+    QApplication::sendEvent(&widget, &release);
+}
+
+Result<const PageView::Control*> boundIn(const Result<PageView*>& view, const QString& page, const QString& control) {
+    if (!view)
+        return view.failure();
+    if (const PageView::Control* bound = (*view)->control(control))
+        return bound;
+    return fail(u"%1 has no control %2"_s.arg(page, control));
+}
+
+Result<const TextList*> listIn(const Result<PageView*>& view, const QString& page, const QString& control) {
+    if (!view)
+        return view.failure();
+    const PageView::Control* bound = (*view)->control(control);
+    if (bound && bound->list)
+        return bound->list;
+    return fail(u"%1 has no list %2"_s.arg(page, control));
+}
+
+// What really takes the press: a list or a text area does so by its viewport.
+QWidget& target(QWidget& widget) {
+    auto* area = qobject_cast<QAbstractScrollArea*>(&widget);
+    return area ? *area->viewport() : widget;
+}
+
+} // namespace
+
+QString ControlFinder::frontPage() const {
+    return m_window.frontView() ? pageName(m_window.frontView()->page().id()) : QString();
+}
+
+Result<PageView*> ControlFinder::view(const QString& page) const {
+    PageView* const below = m_window.viewBelow();
+    const bool inFront = frontPage() == page;
+    if (!inFront && !(below && pageName(below->page().id()) == page))
+        return fail(u"the page in front is %1, not %2"_s.arg(frontPage().isEmpty() ? u"none"_s : frontPage(), page));
+    m_window.renderNow();
+    return inFront ? m_window.frontView() : below;
+}
+
+QString ControlFinder::whyNotPressable(const QWidget& widget) {
+    const QString why = unusable(widget);
+    if (!why.isEmpty())
+        return why;
+    return coveredAt(widget, middleOf(widget));
+}
+
+Result<QWidget*> ControlFinder::inSight(const QString& page, const QString& control) const {
+    const Result<PageView*> found = view(page);
+    if (!found)
+        return found.failure();
+    const PageView::Control* bound = (*found)->control(control);
+    QWidget* widget = bound ? bound->widget.data() : (*found)->findChild<QWidget*>(control);
+    if (!widget)
+        return fail(u"%1 has no control %2 that can be pressed"_s.arg(page, control));
+    const QString why = unusable(*widget);
+    if (!why.isEmpty())
+        return fail(u"%1.%2 is %3"_s.arg(page, control, why));
+    return widget;
+}
+
+Result<QWidget*> ControlFinder::pressable(const QString& page, const QString& control) const {
+    const Result<QWidget*> widget = inSight(page, control);
+    if (!widget)
+        return widget.failure();
+    const QString why = whyNotPressable(**widget);
+    if (!why.isEmpty())
+        return fail(u"%1.%2 is %3"_s.arg(page, control, why));
+    return *widget;
+}
+
+Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control) const {
+    const Result<QWidget*> widget = pressable(page, control);
+    if (!widget)
+        return widget.failure();
+    QWidget& hit = target(**widget);
+    return pressDown(hit, middleOf(hit));
+}
+
+Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control, QPointF percent,
+                                                Qt::MouseButton button) const {
+    const Result<QWidget*> found = inSight(page, control);
+    if (!found)
+        return found.failure();
+    QWidget& widget = **found;
+    const QPoint at = pointOf(widget, percent);
+    const QString why = coveredAt(widget, at);
+    if (!why.isEmpty())
+        return fail(u"%1.%2 at %3 %4 is %5"_s.arg(page, control).arg(percent.x()).arg(percent.y()).arg(why));
+    // What lies there inside the control takes the press, as it would a person's.
+    QWidget* inside = widget.childAt(at);
+    QWidget& hit = inside ? *inside : widget;
+    return pressDown(hit, hit.mapFrom(&widget, at), button);
+}
+
+void ControlFinder::letGo(const Held& held) const {
+    letMouseGo(held);
+}
+
+Result<void> ControlFinder::pressAt(const QString& page, const QString& control, QPointF percent,
+                                    Qt::MouseButton button) const {
+    const Result<Held> held = hold(page, control, percent, button);
+    if (!held)
+        return held.failure();
+    letMouseGo(*held);
+    return {};
+}
+
+Result<void> ControlFinder::drag(const QString& page, const QString& control, QPointF from, QPointF to) const {
+    const Result<QWidget*> found = inSight(page, control);
+    if (!found)
+        return found.failure();
+    // The control may move under the mouse; the way is the one that it was at the press.
+    const QPoint begin = (*found)->mapToGlobal(pointOf(**found, from));
+    const QPoint end = (*found)->mapToGlobal(pointOf(**found, to));
+    Result<Held> held = hold(page, control, from, Qt::LeftButton);
+    if (!held)
+        return held.failure();
+    for (int i = 1; i <= dragMoves && held->widget; ++i) {
+        held->at = held->widget->mapFromGlobal(begin + (end - begin) * i / dragMoves);
+        mouse(*held->widget, held->at, QEvent::MouseMove, Qt::LeftButton, Qt::NoButton);
+    }
+    letMouseGo(*held);
+    return {};
+}
+
+Result<void> ControlFinder::press(const QString& page, const QString& control) const {
+    const Result<QWidget*> widget = pressable(page, control);
+    if (!widget)
+        return widget.failure();
+    QWidget& hit = target(**widget);
+    // A tick box is pressed on its box: its label may be drawn over the whole row.
+    click(hit, middleOf(hit));
+    return {};
+}
+
+Result<void> ControlFinder::type(const QString& page, const QString& control, const QString& text) const {
+    const Result<QWidget*> found = pressable(page, control);
+    if (!found)
+        return found.failure();
+    QWidget* widget = *found;
+    auto* box = qobject_cast<QComboBox*>(widget);
+    if (box && box->isEditable())
+        widget = box->lineEdit();
+    if (!qobject_cast<QLineEdit*>(widget) && !qobject_cast<QPlainTextEdit*>(widget))
+        return fail(u"%1.%2 takes no text"_s.arg(page, control));
+    click(target(*widget), middleOf(target(*widget)));
+    key(*widget, Qt::Key_A, {}, Qt::ControlModifier);
+    key(*widget, Qt::Key_Delete, {});
+    for (const QChar letter : text)
+        key(*widget, letter == u'\n' ? int(Qt::Key_Return) : 0, QString(letter == u'\n' ? QChar(u'\r') : letter));
+    return {};
+}
+
+Result<void> ControlFinder::choose(const QString& page, const QString& control, const QString& text) const {
+    const Result<QWidget*> found = pressable(page, control);
+    if (!found)
+        return found.failure();
+    if (auto* box = qobject_cast<QComboBox*>(*found)) {
+        int row = box->findData(text);
+        if (row < 0)
+            row = box->findText(text);
+        if (row < 0)
+            return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+        // The popup is a window of its own; what follows a press on its row is this.
+        box->setCurrentIndex(row);
+        Q_EMIT box->textActivated(box->itemText(row));
+        Q_EMIT box->activated(row);
+        return {};
+    }
+    if (auto* list = qobject_cast<QListWidget*>(*found)) {
+        for (int row = 0; row < list->count(); ++row) {
+            QListWidgetItem* item = list->item(row);
+            if (item->data(Qt::UserRole).toString() != text && item->text() != text)
+                continue;
+            list->scrollToItem(item);
+            click(*list->viewport(), list->visualItemRect(item).center());
+            return {};
+        }
+        return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+    }
+    if (auto* cards = qobject_cast<ChoiceCards*>(*found)) {
+        QAbstractButton* card = cards->card(text);
+        if (!card)
+            return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+        click(*card, middleOf(*card));
+        return {};
+    }
+    return fail(u"%1.%2 has no rows"_s.arg(page, control));
+}
+
+Result<void> ControlFinder::tick(const QString& page, const QString& control, bool on) const {
+    const Result<QWidget*> found = pressable(page, control);
+    if (!found)
+        return found.failure();
+    auto* button = qobject_cast<QAbstractButton*>(*found);
+    if (!button || !button->isCheckable())
+        return fail(u"%1.%2 can't be ticked"_s.arg(page, control));
+    if (button->isChecked() != on) {
+        const QRect box = button->rect();
+        // Where its mark stands: a tick box answers only on its own contents.
+        click(*button,
+              qobject_cast<QCheckBox*>(button)
+                  ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())
+                  : middleOf(*button));
+    }
+    return {};
+}
+
+Result<QString> ControlFinder::text(const QString& page, const QString& control) const {
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    if (!found)
+        return found.failure();
+    const PageView::Control& is = **found;
+    if (is.text)
+        return is.text();
+    if (is.caption)
+        return is.caption->text;
+    if (is.list)
+        return is.list->currentItem();
+    return fail(u"%1.%2 has no text"_s.arg(page, control));
+}
+
+Result<bool> ControlFinder::visible(const QString& page, const QString& control) const {
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    if (!found)
+        return found.failure();
+    const QWidget* widget = (*found)->widget;
+    return widget && widget->isVisible();
+}
+
+Result<bool> ControlFinder::enabled(const QString& page, const QString& control) const {
+    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    if (!found)
+        return found.failure();
+    const PageView::Control& is = **found;
+    return is.widget ? is.widget->isEnabled() : is.caption && is.caption->enabled;
+}
+
+Result<int> ControlFinder::count(const QString& page, const QString& control) const {
+    const Result<const TextList*> found = listIn(view(page), page, control);
+    if (!found)
+        return found.failure();
+    return (*found)->count();
+}
+
+Result<QString> ControlFinder::item(const QString& page, const QString& control, int index) const {
+    const Result<const TextList*> found = listIn(view(page), page, control);
+    if (!found)
+        return found.failure();
+    const int count = (*found)->count();
+    if (index < 0 || index >= count)
+        return fail(u"%1.%2 has %3 rows, none with the index %4"_s.arg(page, control).arg(count).arg(index));
+    return (*found)->item(index);
+}
+
+} // namespace lumora

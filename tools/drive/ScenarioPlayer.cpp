@@ -1,0 +1,319 @@
+#include "drive/ScenarioPlayer.h"
+
+#include "app/Program.h"
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QPixmap>
+#include <QSaveFile>
+
+#include <cmath>
+
+namespace lumora {
+
+namespace {
+
+constexpr int betweenSteps = 5;         // milliseconds
+constexpr double patienceOfMessage = 5; // seconds: a box may come from a timer of its page
+constexpr double patienceOfWork = 900;  // seconds until work that does not come to rest has failed
+
+bool touches(ScenarioVerb verb) {
+    return verb == ScenarioVerb::Press || verb == ScenarioVerb::PressAt || verb == ScenarioVerb::Hold ||
+           verb == ScenarioVerb::Drag || verb == ScenarioVerb::Type || verb == ScenarioVerb::Choose ||
+           verb == ScenarioVerb::Tick;
+}
+
+QString quoted(const QString& text) {
+    QString shown = text;
+    shown.replace(u'\\', QStringLiteral("\\\\")).replace(u'\n', QStringLiteral("\\n"));
+    return u'"' + shown + u'"';
+}
+
+QString inWords(const Result<QString>& text) {
+    return text ? quoted(*text) : text.failure().message;
+}
+QString inWords(const Result<int>& count) {
+    return count ? QString::number(*count) : count.failure().message;
+}
+QString inWords(const Result<bool>& flag) {
+    return !flag ? flag.failure().message : *flag ? QStringLiteral("yes") : QStringLiteral("no");
+}
+
+} // namespace
+
+ScenarioPlayer::ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, QString shots)
+    : m_program(program)
+    , m_controls(program.window())
+    , m_files(std::move(files))
+    , m_shots(std::move(shots)) {
+    m_program.dialogs().nextPick = [this] { return takePick(); };
+    m_program.dialogs().nextAnswer = [this] { return takeAnswer(); };
+    m_timer.setInterval(betweenSteps);
+    connect(&m_timer, &QTimer::timeout, this, &ScenarioPlayer::step);
+    m_letGo.setSingleShot(true);
+    m_letGo.setTimerType(Qt::PreciseTimer);
+    connect(&m_letGo, &QTimer::timeout, this, &ScenarioPlayer::letGo);
+    m_atThisLine.start();
+}
+
+void ScenarioPlayer::step() {
+    while (m_file < m_files.size() && m_command == m_files[m_file].commands().size()) {
+        ++m_file;
+        m_command = 0;
+    }
+    if (m_finished || m_held)
+        return;
+    const bool busy = m_program.platform().pump.pumping();
+    if (m_file == m_files.size()) {
+        if (!busy)
+            finish();
+        return;
+    }
+    if (m_program.chain().hasEnded())
+        return fail(place(), QStringLiteral("a running program"), QStringLiteral("it has ended"));
+
+    const ScenarioCommand& command = m_files[m_file].commands()[m_command];
+    if (!mayRunNow(command.verb)) {
+        if (m_atThisLine.elapsed() > patienceOfWork * 1000)
+            fail(place(), QStringLiteral("the end of the work before this line"), QStringLiteral("work without end"));
+        return;
+    }
+    if (touches(command.verb))
+        return touch(command);
+
+    m_program.window().renderNow();
+    const Look seen = look(command);
+    if (seen.held) {
+        if (command.verb == ScenarioVerb::Page || command.verb == ScenarioVerb::Until ||
+            command.verb == ScenarioVerb::Pause)
+            m_goesOnInTheMiddle = busy;
+        moveOn();
+    } else if (m_atThisLine.elapsed() >= seen.patience * 1000) {
+        fail(place(), seen.wanted, seen.found);
+    }
+}
+
+bool ScenarioPlayer::mayRunNow(ScenarioVerb verb) const {
+    if (m_goesOnInTheMiddle || !m_program.platform().pump.pumping())
+        return true;
+    switch (verb) {
+    case ScenarioVerb::Page:
+    case ScenarioVerb::Until:
+    case ScenarioVerb::Pause:
+    case ScenarioVerb::Shot:
+    case ScenarioVerb::Dump:
+    case ScenarioVerb::Pick:
+    case ScenarioVerb::Answer:
+        return true;
+    default:
+        return false;
+    }
+}
+
+// The handler behind a control may pump, and then the next lines run inside it: the place moves on before.
+void ScenarioPlayer::touch(const ScenarioCommand& command) {
+    const QString here = place();
+    m_goesOnInTheMiddle = false;
+    moveOn();
+
+    m_program.dialogs().closeMessages();
+    m_program.window().renderNow();
+    const Result<void> touched = use(command);
+    if (!touched)
+        fail(here, QStringLiteral("%1.%2 in reach").arg(command.page, command.control), touched.failure().message);
+}
+
+Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
+    const QString& page = command.page;
+    const QString& control = command.control;
+    switch (command.verb) {
+    case ScenarioVerb::PressAt:
+        return m_controls.pressAt(page, control, command.from, command.rightKey ? Qt::RightButton : Qt::LeftButton);
+    case ScenarioVerb::Drag:
+        return m_controls.drag(page, control, command.from, command.to);
+    case ScenarioVerb::Type:
+        return m_controls.type(page, control, command.text);
+    case ScenarioVerb::Choose:
+        return m_controls.choose(page, control, command.text);
+    case ScenarioVerb::Tick:
+        return m_controls.tick(page, control, command.yes);
+    case ScenarioVerb::Hold: {
+        const Result<ControlFinder::Held> held = m_controls.hold(page, control);
+        if (!held)
+            return held.failure();
+        m_held = *held;
+        m_letGo.start(static_cast<int>(std::lround(command.seconds * 1000)));
+        return {};
+    }
+    default:
+        return m_controls.press(page, control);
+    }
+}
+
+void ScenarioPlayer::letGo() {
+    if (const auto held = std::exchange(m_held, std::nullopt))
+        m_controls.letGo(*held);
+}
+
+ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
+    const QString name = command.page + u'.' + command.control;
+    switch (command.verb) {
+    case ScenarioVerb::Page: {
+        const QString front = m_controls.frontPage();
+        return {front == command.page, QStringLiteral("page %1").arg(command.page),
+                front.isEmpty() ? QStringLiteral("no page") : QStringLiteral("page %1").arg(front), command.seconds};
+    }
+    case ScenarioVerb::Expect:
+    case ScenarioVerb::Until: {
+        const Result<QString> text = m_controls.text(command.page, command.control);
+        return {text && *text == command.text, name + u' ' + quoted(command.text), inWords(text), command.seconds};
+    }
+    case ScenarioVerb::ExpectVisible: {
+        const Result<bool> visible = m_controls.visible(command.page, command.control);
+        return {visible && *visible == command.yes,
+                name + (command.yes ? QStringLiteral(" visible: yes") : QStringLiteral(" visible: no")),
+                inWords(visible)};
+    }
+    case ScenarioVerb::ExpectCount: {
+        const Result<int> count = m_controls.count(command.page, command.control);
+        return {count && *count == command.number, QStringLiteral("%1 count %2").arg(name).arg(command.number),
+                inWords(count)};
+    }
+    case ScenarioVerb::ExpectItem: {
+        const Result<QString> item = m_controls.item(command.page, command.control, command.number);
+        return {item && *item == command.text,
+                QStringLiteral("%1 item %2 ").arg(name).arg(command.number) + quoted(command.text), inWords(item)};
+    }
+    case ScenarioVerb::ExpectMessage:
+        return lookForMessage(command.text);
+    case ScenarioVerb::Pause:
+        return waitForPause(command.seconds);
+    case ScenarioVerb::Dump:
+        return dump(command);
+    case ScenarioVerb::Shot:
+        return shoot(command.text);
+    case ScenarioVerb::Pick:
+        return preparePick(command.text);
+    case ScenarioVerb::Answer:
+        m_answers += command.yes;
+        return {true, {}, {}};
+    case ScenarioVerb::Press:
+    case ScenarioVerb::PressAt:
+    case ScenarioVerb::Hold:
+    case ScenarioVerb::Drag:
+    case ScenarioVerb::Type:
+    case ScenarioVerb::Choose:
+    case ScenarioVerb::Tick:
+        break; // touch() does these
+    }
+    return {};
+}
+
+ScenarioPlayer::Look ScenarioPlayer::lookForMessage(const QString& wanted) {
+    const QStringList& shown = m_program.dialogs().shownTexts;
+    const QString said = QStringLiteral("the message ") + quoted(wanted);
+    if (m_messagesTaken >= shown.size())
+        return {false, said, QStringLiteral("no message"), patienceOfMessage};
+    // Some of the texts end their lines with a carriage return, which no scenario can write.
+    QString oldest = shown[m_messagesTaken++];
+    oldest.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n');
+    return {oldest == wanted, said, quoted(oldest)};
+}
+
+ScenarioPlayer::Look ScenarioPlayer::waitForPause(double seconds) const {
+    return {static_cast<double>(m_atThisLine.elapsed()) >= seconds * 1000, {}, {}, seconds + patienceOfWork};
+}
+
+ScenarioPlayer::Look ScenarioPlayer::dump(const ScenarioCommand& command) const {
+    const QString wanted = QStringLiteral("what %1.%2 holds in %3").arg(command.page, command.control, command.text);
+    QString content;
+    if (const Result<int> count = m_controls.count(command.page, command.control)) {
+        for (int i = 0; i < *count; ++i) {
+            const Result<QString> item = m_controls.item(command.page, command.control, i);
+            if (!item)
+                return {false, wanted, item.failure().message};
+            content += *item + u'\n';
+        }
+    } else {
+        const Result<QString> text = m_controls.text(command.page, command.control);
+        if (!text)
+            return {false, wanted, text.failure().message};
+        content = *text + u'\n';
+    }
+    QSaveFile file(command.text);
+    const bool written = file.open(QIODevice::WriteOnly) && file.write(content.toUtf8()) >= 0 && file.commit();
+    return {written, wanted, file.errorString()};
+}
+
+ScenarioPlayer::Look ScenarioPlayer::shoot(const QString& name) const {
+    const QString path = QDir(m_shots).filePath(name + QStringLiteral(".png"));
+    return {QDir().mkpath(m_shots) && m_program.window().grab().save(path, "PNG"),
+            QStringLiteral("the picture ") + path, QStringLiteral("it can't be written")};
+}
+
+ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
+    const QFileInfo picked(hostPath);
+    const Files& files = m_program.platform().files;
+    QString path = files.drives().toDrive(toHostPath(picked.canonicalFilePath()));
+    if (picked.isDir()) {
+        const QStringList pictures = files.names(path, QStringLiteral("*.jpg;*.jpeg"));
+        if (pictures.isEmpty())
+            return {false, QStringLiteral("a picture in ") + hostPath, QStringLiteral("none")};
+        path = JoinDrivePath(path, pictures.front());
+    } else if (!picked.isFile()) {
+        return {false, QStringLiteral("the file ") + hostPath, QStringLiteral("it does not exist")};
+    }
+    m_picks += AnsiCodePage::squeeze(path);
+    return {true, {}, {}};
+}
+
+std::optional<QString> ScenarioPlayer::takePick() {
+    if (!m_picks.isEmpty())
+        return m_picks.takeFirst();
+    fail(place(), QStringLiteral("no file dialog"), QStringLiteral("one, and no pick was prepared for it"));
+    return QString();
+}
+
+std::optional<bool> ScenarioPlayer::takeAnswer() {
+    if (!m_answers.isEmpty())
+        return m_answers.takeFirst();
+    fail(place(), QStringLiteral("no question"),
+         QStringLiteral("one, and no answer was prepared for it: ") +
+             quoted(m_program.dialogs().shownTexts.value(m_program.dialogs().shownTexts.size() - 1)));
+    return false;
+}
+
+void ScenarioPlayer::moveOn() {
+    ++m_command;
+    m_atThisLine.start();
+}
+
+QString ScenarioPlayer::place() const {
+    if (m_file == m_files.size())
+        return QStringLiteral("at the end");
+    const ScenarioFile& file = m_files[m_file];
+    const std::size_t command = std::min(m_command, file.commands().size() - 1);
+    return QStringLiteral("%1:%2").arg(file.name()).arg(file.commands()[command].line);
+}
+
+void ScenarioPlayer::fail(const QString& where, const QString& wanted, const QString& found) {
+    if (m_failure.isEmpty())
+        m_failure = QStringLiteral("%1: wanted %2, found %3").arg(where, wanted, found);
+    finish();
+}
+
+void ScenarioPlayer::finish() {
+    m_timer.stop();
+    if (!std::exchange(m_finished, true))
+        Q_EMIT finished();
+}
+
+} // namespace lumora

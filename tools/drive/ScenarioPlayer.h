@@ -1,0 +1,89 @@
+#pragma once
+
+#include "drive/ControlFinder.h"
+#include "drive/ScenarioFile.h"
+
+#include <QElapsedTimer>
+#include <QObject>
+#include <QStringList>
+#include <QTimer>
+
+#include <optional>
+
+namespace lumora {
+
+class Program;
+
+// Does at the pages what scenario files say, as a customer would: from the event loop, so that it also sees and stops
+// work that is under way. Before it touches a control it closes the message boxes that are open.
+//
+// A line waits until the work that the lines before it set off has come to rest. Only page, until, pause, shot, dump,
+// pick and answer go on in the middle of such work, and what stands behind a page, until or pause that was fulfilled
+// there follows at once.
+class ScenarioPlayer : public QObject {
+    Q_OBJECT
+public:
+    // shots: the host folder of the pictures.
+    ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, QString shots);
+
+    void start() { m_timer.start(); }
+
+    // To be called when the event loop has ended: lines that are left then fail, since the program is gone.
+    void settle() { step(); }
+
+    // Empty while all held; else "FILE:LINE: what was wanted, what was found" of the line that failed.
+    const QString& failure() const { return m_failure; }
+    bool allHeld() const { return m_finished && m_failure.isEmpty(); }
+
+Q_SIGNALS:
+    // All lines held, or one has failed.
+    void finished();
+
+private:
+    // What one line found.
+    struct Look {
+        bool held = false;
+        QString wanted;
+        QString found;
+        double patience = 0; // seconds until a line that does not hold has failed
+    };
+
+    void step();
+    bool mayRunNow(ScenarioVerb verb) const;
+    void touch(const ScenarioCommand& command);
+    Result<void> use(const ScenarioCommand& command);
+    void letGo();
+    Look look(const ScenarioCommand& command);
+    Look lookForMessage(const QString& wanted);
+    Look waitForPause(double seconds) const;
+    Look dump(const ScenarioCommand& command) const;
+    Look shoot(const QString& name) const;
+    Look preparePick(const QString& hostPath);
+    std::optional<QString> takePick();
+    std::optional<bool> takeAnswer();
+
+    void moveOn();
+    QString place() const;
+    void fail(const QString& place, const QString& wanted, const QString& found);
+    void finish();
+
+    Program& m_program;
+    ControlFinder m_controls;
+    std::vector<ScenarioFile> m_files;
+    QString m_shots;
+
+    QTimer m_timer;
+    std::size_t m_file = 0;
+    std::size_t m_command = 0;
+    QElapsedTimer m_atThisLine;
+    std::optional<ControlFinder::Held> m_held;
+    QTimer m_letGo;
+    bool m_goesOnInTheMiddle = false;
+    bool m_finished = false;
+    qsizetype m_messagesTaken = 0; // of ScreenDialogs::shownTexts
+    QStringList m_picks;           // drive paths
+    QList<bool> m_answers;
+    QString m_failure;
+};
+
+} // namespace lumora

@@ -1,0 +1,95 @@
+#include "app/Program.h"
+#include "drive/ScenarioPlayer.h"
+#include "views/window/Application.h"
+
+#include <QCommandLineParser>
+
+#include <cstdio>
+#include <cstdlib>
+
+using namespace lumora;
+
+namespace {
+
+constexpr int aLineFailed = 1;
+constexpr int notPlayed = 2;
+
+int complain(const QString& text, int status) {
+    std::fprintf(stderr, "%s\n", qUtf8Printable(text));
+    return status;
+}
+
+// An empty size for what is none.
+QSize sizeIn(const QString& text) {
+    const QStringList sides = text.split(u'x');
+    if (sides.size() != 2)
+        return {};
+    const QSize size(sides[0].toInt(), sides[1].toInt());
+    return size.width() >= 640 && size.height() >= 480 && size.width() <= 7680 && size.height() <= 7680 ? size
+                                                                                                        : QSize();
+}
+
+int play(int argc, char** argv) {
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    Application application(argc, argv);
+    Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(
+        QStringLiteral("Runs the pages of lumora without a screen and does at them what scenario files say, a command "
+                       "a line:\n\n") +
+        scenarioHelp() +
+        QStringLiteral("\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n"
+                       "Exit status: 0 all held, 1 a line failed, 2 nothing could be played."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    parser.addOptions(
+        {{QStringLiteral("lab"), QStringLiteral("The deployment file of the lab."), QStringLiteral("FILE")},
+         {QStringLiteral("size"), QStringLiteral("The window, from 640x480 on."), QStringLiteral("WxH"),
+          QStringLiteral("1280x1024")},
+         {QStringLiteral("shots"), QStringLiteral("Where the pictures of shot go."), QStringLiteral("DIR"),
+          QStringLiteral(".")}});
+    parser.addPositionalArgument(QStringLiteral("SCENARIO..."),
+                                 QStringLiteral("The files, played one after the other."));
+    if (!parser.parse(QCoreApplication::arguments()))
+        return complain(parser.errorText(), notPlayed);
+    if (parser.isSet(QStringLiteral("help")))
+        parser.showHelp();
+    if (parser.isSet(QStringLiteral("version")))
+        parser.showVersion();
+
+    ProgramOptions options;
+    options.windowSize = sizeIn(parser.value(QStringLiteral("size")));
+    if (options.windowSize.isEmpty())
+        return complain(
+            QStringLiteral("--size: %1 is no size such as 1280x1024").arg(parser.value(QStringLiteral("size"))),
+            notPlayed);
+    if (parser.isSet(QStringLiteral("lab")))
+        options.labFile = toHostPath(parser.value(QStringLiteral("lab")));
+
+    if (parser.positionalArguments().isEmpty())
+        return complain(QStringLiteral("No scenario is named; --help tells more."), notPlayed);
+    std::vector<ScenarioFile> files;
+    for (const QString& path : parser.positionalArguments()) {
+        Result<ScenarioFile> file = ScenarioFile::load(path);
+        if (!file)
+            return complain(file.failure().message, notPlayed);
+        files.push_back(std::move(*file));
+    }
+
+    Program program(options);
+    if (const Result<void> started = program.start(); !started)
+        return complain(started.failure().message, notPlayed);
+    ScenarioPlayer player(program, std::move(files), parser.value(QStringLiteral("shots")));
+    QObject::connect(&player, &ScenarioPlayer::finished, &application, &QCoreApplication::quit);
+    player.start();
+    QApplication::exec();
+    player.settle();
+    return player.allHeld() ? EXIT_SUCCESS : complain(player.failure(), aLineFailed);
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    return play(argc, argv);
+}

@@ -1,0 +1,167 @@
+// The lab's side of a print file, for people who build the lab's tools.
+
+#include "order/OrderCheck.h"
+#include "order/OrderTail.h"
+#include "order/PrintFileName.h"
+#include "platform/files/HostPath.h"
+
+#include <QCommandLineParser>
+#include <QCoreApplication>
+#include <QSaveFile>
+#include <QTextStream>
+
+using namespace lumora;
+
+namespace {
+
+enum ExitCode { allWell = 0, faultFound = 1, notUnderstood = 2 };
+
+QTextStream& out() {
+    static QTextStream stream(stdout);
+    return stream;
+}
+
+QTextStream& err() {
+    static QTextStream stream(stderr);
+    return stream;
+}
+
+Result<PrintFileContent> readFile(const QString& path, PrintFileShape shape) {
+    const Result<QByteArray> bytes = readHostFile(toHostPath(path));
+    if (!bytes)
+        return bytes.failure();
+    Result<PrintFileContent> content = readPrintFile(*bytes, shape);
+    if (!content)
+        return Failure{content.failure().kind, path + QStringLiteral(": ") + content.failure().message};
+    return content;
+}
+
+int info(const QStringList& files, PrintFileShape shape) {
+    int code = allWell;
+    for (const QString& path : files) {
+        // The order sheet lies among the print files under the same ending.
+        if (const Result<QByteArray> bytes = readHostFile(toHostPath(path)); bytes && checkWholeJpeg(*bytes)) {
+            out() << path << "\n  a plain picture, as an order sheet is: " << bytes->size() << " bytes" << Qt::endl;
+            continue;
+        }
+        const Result<PrintFileContent> content = readFile(path, shape);
+        if (!content) {
+            err() << content.failure().message << Qt::endl;
+            code = faultFound;
+            continue;
+        }
+        out() << path << '\n';
+        if (const auto name = PrintFileName::parse(toText(toHostPath(path).filename())))
+            out() << "  code          " << name->code << "  (" << name->copies() << " copies)\n"
+                  << "  place         " << name->index << '\n'
+                  << "  kind          " << name->optint << '\n'
+                  << "  picture name  " << name->baseName << '\n';
+        out() << "  picture       " << content->picture.size() << " bytes\n"
+              << "  pieces        " << shape.chunks << " of " << content->piece << " bytes, " << content->remainder
+              << " behind\n"
+              << "  tail          " << content->tail.size() << " bytes\n";
+        if (const auto tail = OrderTail::parse(content->tail)) {
+            out() << "    telephone   " << tail->telephone << '\n'
+                  << "    name        " << tail->name << '\n'
+                  << "    total       " << tail->totalPics << '\n'
+                  << "    order       " << tail->orderNumber << '\n'
+                  << "    serial      " << tail->serial << '\n';
+            if (content->tail.size() == OrderTail::longWidth)
+                out() << "    picture     " << tail->baseName << '\n';
+        }
+        if (const Result<void> whole = checkWholeJpeg(content->picture); !whole) {
+            err() << path << ": " << whole.failure().message << Qt::endl;
+            code = faultFound;
+        }
+        out().flush();
+    }
+    return code;
+}
+
+int unpack(const QString& source, const QString& target, PrintFileShape shape) {
+    const Result<PrintFileContent> content = readFile(source, shape);
+    if (!content) {
+        err() << content.failure().message << Qt::endl;
+        return faultFound;
+    }
+    QSaveFile file(target);
+    if (!file.open(QIODevice::WriteOnly) || file.write(content->picture) != content->picture.size() || !file.commit()) {
+        err() << target << ": " << file.errorString() << Qt::endl;
+        return faultFound;
+    }
+    return allWell;
+}
+
+int check(const QStringList& folders, PrintFileShape shape) {
+    int code = allWell;
+    for (const QString& folder : folders) {
+        const Result<OrderFindings> report = checkOrderFolder(toHostPath(folder), shape);
+        if (!report) {
+            err() << report.failure().message << Qt::endl;
+            code = faultFound;
+            continue;
+        }
+        for (const QString& fault : report->faults)
+            err() << folder << ": " << fault << Qt::endl;
+        if (!report->faults.isEmpty())
+            code = faultFound;
+        out() << "order " << report->order << ": " << report->items << " lines, " << report->copies << " copies, "
+              << report->prints << " print files whole, " << report->failed << " pictures failed, "
+              << report->faults.size() << " faults" << Qt::endl;
+    }
+    return code;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    QCoreApplication application(argc, argv);
+    QCoreApplication::setApplicationName(QStringLiteral("lumora-jpp"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(
+        QStringLiteral("Reads print files.\n\n"
+                       "  lumora-jpp info FILE...            what print files hold\n"
+                       "  lumora-jpp unpack FILE OUT.jpg     the picture of a print file\n"
+                       "  lumora-jpp check ORDER_FOLDER...   whether an order is whole\n\n"
+                       "Exit status: 0 all is well, 1 a file or an order is at fault, 2 the call is."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    const QCommandLineOption base(QStringLiteral("base"),
+                                  QStringLiteral("What the profile adds to the length of a piece (30)."),
+                                  QStringLiteral("NUMBER"), QStringLiteral("30"));
+    const QCommandLineOption chunks(QStringLiteral("chunks"),
+                                    QStringLiteral("Pieces of a print file, 1 to 32767 (56)."),
+                                    QStringLiteral("NUMBER"), QStringLiteral("56"));
+    parser.addOptions({base, chunks});
+    parser.addPositionalArgument(QStringLiteral("command"), QStringLiteral("info, unpack or check"));
+    parser.addPositionalArgument(QStringLiteral("arguments"), QStringLiteral("as above"),
+                                 QStringLiteral("ARGUMENT..."));
+    if (!parser.parse(QCoreApplication::arguments())) {
+        err() << parser.errorText() << Qt::endl;
+        return notUnderstood;
+    }
+    if (parser.isSet(QStringLiteral("version")))
+        parser.showVersion();
+    if (parser.isSet(QStringLiteral("help")))
+        parser.showHelp();
+
+    bool baseOk = false;
+    bool chunksOk = false;
+    const PrintFileShape shape{parser.value(chunks).toInt(&chunksOk), parser.value(base).toInt(&baseOk)};
+    if (!baseOk || !chunksOk || shape.chunks < 1 || shape.chunks > 32767) {
+        err() << "--base takes a number, --chunks a number from 1 to 32767." << Qt::endl;
+        return notUnderstood;
+    }
+    QStringList arguments = parser.positionalArguments();
+    const QString command = arguments.isEmpty() ? QString() : arguments.takeFirst();
+    if (command == QLatin1String("info") && !arguments.isEmpty())
+        return info(arguments, shape);
+    if (command == QLatin1String("unpack") && arguments.size() == 2)
+        return unpack(arguments[0], arguments[1], shape);
+    if (command == QLatin1String("check") && !arguments.isEmpty())
+        return check(arguments, shape);
+    err() << parser.helpText() << Qt::flush;
+    return notUnderstood;
+}
