@@ -103,7 +103,7 @@ public:
         }
         m_pictures = *written;
         m_state.DiskRoot = m_machine.drives.programRoot();
-        m_state.Optint = kind == Kind::Plain ? 1 : 2;
+        m_state.Optint = kind == Kind::Plain ? OrderKind::Print : OrderKind::EditedPrint;
         m_state.profile.JppBase = 30;
         m_state.profile.JppChunks = 56;
         m_state.shemot.ppr = QStringLiteral("10/15");

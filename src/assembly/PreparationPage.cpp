@@ -166,23 +166,23 @@ bool PreparationPage::writeLog(const OrderFolder& folder, const QByteArray& log)
     return true;
 }
 
-void PreparationPage::handOver(std::optional<PageId> next) {
+void PreparationPage::handOver(Outcome prepared) {
     m_handedOver = true;
-    m_state.transfer.SugMishloah = 0;
-    const QString prepared =
+    m_state.transfer.SugMishloah = Sending::NewOrder;
+    const QString kept =
         m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
             .arg(m_state.MisparHazmana);
-    if (!next) {
-        m_state.handOver.notice = prepared;
-    } else if (!m_chain.isRegistered(*next)) {
+    if (prepared == Outcome::KeptAtStation)
+        m_state.handOver.notice = kept;
+    if (!m_chain.canFollow(id(), prepared)) {
         tell(QStringLiteral("ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."),
              QStringLiteral("The order is ready, but this version has no page to go on with it."),
              m_state.transfer.OrderFolder);
-        m_state.handOver.notice = prepared;
-    } else {
-        m_chain.show(*next);
+        m_state.handOver.notice = kept;
+        m_chain.unload(id());
+        return;
     }
-    m_chain.unload(id());
+    m_chain.follow(id(), prepared);
 }
 
 void PreparationPage::tell(const QString& hebrew, const QString& english, const QString& reason) {

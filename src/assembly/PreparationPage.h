@@ -16,6 +16,7 @@ namespace lumora {
 struct Platform;
 struct SessionState;
 class PageChain;
+enum class Outcome;
 
 // What the two pages share that turn a basket into an order folder: the list with its progress, the loop over the
 // pictures, what is written behind it, the hand-over to a sender, and the words for all that can go wrong.
@@ -71,7 +72,7 @@ protected:
     bool writeLog(const OrderFolder& folder, const QByteArray& log);
 
     // The order is whole: shows the page that goes on with it, or none at a local station, and leaves.
-    void handOver(std::optional<PageId> next);
+    void handOver(Outcome prepared);
     bool handedOver() const { return m_handedOver; }
 
     void tell(const QString& hebrew, const QString& english, const QString& reason = {});

@@ -40,7 +40,7 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
     if (!m_folderThere)
         return {false, m_folderThere.failure()};
     const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));
-    const QString name = PrintFileName{line.code, line.index, m_state.Optint, base}.text();
+    const QString name = PrintFileName{line.code, line.index, static_cast<int>(m_state.Optint), base}.text();
     const Result<void> written =
         packed ? m_files.writeWhole(m_folder.printFilePath(name), *packed) : Result<void>(packed.failure());
     return written ? Outcome{true, {}} : Outcome{false, written.failure()};

@@ -44,7 +44,7 @@ void writePrintHead(ListOutput& log, const SessionState& state, const QDateTime&
     log.pair(QStringLiteral("Shemot.Girsa"), state.shemot.Girsa);
     log.text(QStringLiteral("Time")).date(now).endLine();
     log.pair(QStringLiteral("Hazmana"), orderName(state));
-    log.text(QStringLiteral("Optint")).number(state.Optint).endLine();
+    log.text(QStringLiteral("Optint")).number(static_cast<std::int16_t>(state.Optint)).endLine();
     writeDetails(log, state.shemot);
 }
 
@@ -57,7 +57,7 @@ void writeAlbumHead(ListOutput& log, const SessionState& state, const QDateTime&
     log.pair(QStringLiteral("Girsa"), state.shemot.Girsa);
     log.text(QStringLiteral("Time")).date(now).endLine();
     log.pair(QStringLiteral("Hazmana"), orderName(state));
-    log.text(QStringLiteral("Optint")).number(state.Optint).endLine();
+    log.text(QStringLiteral("Optint")).number(static_cast<std::int16_t>(state.Optint)).endLine();
     log.pair(QStringLiteral("ser"), state.shemot.ser);
     log.text(QStringLiteral("TotalPics")).number(state.shemot.TotalPics).endLine();
     log.pair(QStringLiteral("GodelLBM"), album.GodelLBM);
@@ -102,7 +102,7 @@ void writeTail(ListOutput& log, const QStringList& items, const QStringList& fai
 QByteArray plainOrderLog(const SessionState& state, const QStringList& items, const QStringList& failed,
                          const QDateTime& now) {
     ListOutput log;
-    if (state.Optint == 10)
+    if (state.Optint == OrderKind::Album)
         writeAlbumHead(log, state, now);
     else
         writePrintHead(log, state, now);

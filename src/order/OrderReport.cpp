@@ -7,7 +7,7 @@ namespace lumora {
 namespace {
 
 bool isReported(const SessionState& state) {
-    return state.transfer.SugMishloah == 0 || state.transfer.SugMishloah == 1;
+    return state.transfer.SugMishloah == Sending::NewOrder || state.transfer.SugMishloah == Sending::Resend;
 }
 
 // A line break inside a value would end the request line.

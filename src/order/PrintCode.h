@@ -1,13 +1,12 @@
 #pragma once
 
 #include "common/FixedText.h"
+#include "session/SessionState.h"
 
 #include <QChar>
 #include <QString>
 
 namespace lumora {
-
-struct OrderDetails;
 
 // The first nine characters of a basket line: copies (2), size code (4), paper letter (1), border code (2). All later
 // stages cut it by position.
@@ -41,11 +40,8 @@ QString sizeField(const OrderDetails& shemot);
 // How the lines of a basket are built. An edited order carries the edit record between code and path.
 enum class LineForm { Short, Full };
 
-constexpr bool isPlainMode(int optint) {
-    return optint == 1 || optint == 3 || optint == 10;
-}
-constexpr LineForm lineFormOf(int optint) {
-    return isPlainMode(optint) ? LineForm::Short : LineForm::Full;
+constexpr LineForm lineFormOf(OrderKind kind) {
+    return printsAsTheyAre(kind) ? LineForm::Short : LineForm::Full;
 }
 
 // One line of the basket: code (9), in the full form the edit record (200), then the full path in any length.

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "session/Controls.h"
+
 #include <QObject>
 #include <QString>
 
@@ -37,6 +39,8 @@ public:
         : m_id(id) {}
 
     PageId id() const { return m_id; }
+    // What the page shows, for views, scenarios and tests: to be read only. None here.
+    virtual const Controls& controls() const;
     virtual void load() {}
     // Runs the place where all the page's texts are set, in the language of the session.
     virtual void setTexts() {}

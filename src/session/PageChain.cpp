@@ -6,17 +6,9 @@
 #include <QTimer>
 
 #include <algorithm>
-#include <array>
 #include <cassert>
 
 namespace lumora {
-
-QString pageName(PageId id) {
-    static constexpr std::array<const char*, 17> names = {
-        "hatchala", "nnn", "Havharot", "kyoskNew", "tFrmNew",    "BigPics",  "RedI",      "mikledet", "gdisave",
-        "Form3",    "B3",  "Form2",    "FtpFrm",   "UploadForm", "InetForm", "MoogMeret", "SpltForm"};
-    return QString::fromLatin1(names[static_cast<std::size_t>(id)]);
-}
 
 PageChain::~PageChain() = default;
 
@@ -43,6 +35,20 @@ bool PageChain::show(PageId id) {
     m_shown.push_back(page);
     Q_EMIT shown(page);
     return true;
+}
+
+bool PageChain::follow(PageId from, Outcome outcome) {
+    const std::optional<PageWay> way = wayFrom(from, outcome);
+    if (!way || !show(way->to))
+        return false;
+    if (way->then == PageWay::From::IsLeft)
+        unload(from);
+    return true;
+}
+
+bool PageChain::canFollow(PageId from, Outcome outcome) const {
+    const std::optional<PageWay> way = wayFrom(from, outcome);
+    return way && isRegistered(way->to);
 }
 
 void PageChain::unload(PageId id) {

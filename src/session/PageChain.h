@@ -1,6 +1,6 @@
 #pragma once
 
-#include "session/Page.h"
+#include "session/PageFlow.h"
 
 #include <functional>
 #include <map>
@@ -26,6 +26,16 @@ public:
     // The page with this id, made and loaded if it does not exist yet, without bringing it to the front. A service page
     // such as gdisave is used this way.
     Page& load(PageId id);
+    // The same as the page's own class.
+    template <typename P>
+    P& load() {
+        return static_cast<P&>(load(P::pageId));
+    }
+
+    // Goes the way that the page flow has for what happened on a page: shows the next page and unloads the one that is
+    // left. False, and nothing happens, where no such page is registered.
+    bool follow(PageId from, Outcome outcome);
+    bool canFollow(PageId from, Outcome outcome) const;
 
     // Loads the page if need be and brings it to the front. False when no page of that id was registered.
     bool show(PageId id);
@@ -36,6 +46,10 @@ public:
     void unload(PageId id);
 
     Page* find(PageId id) const;
+    template <typename P>
+    P* find() const {
+        return static_cast<P*>(find(P::pageId));
+    }
     Page* front() const { return m_shown.empty() ? nullptr : m_shown.back(); }
     bool isRegistered(PageId id) const { return m_makers.contains(id); }
 

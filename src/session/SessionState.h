@@ -150,14 +150,38 @@ struct EditFields {
 };
 
 // What the senders share.
+// The kind of an order, under the numbers that the order log, the print files and their names carry.
+enum class OrderKind : std::int16_t {
+    NotChosen = 0,
+    Print = 1,
+    EditedPrint = 2,
+    Sequence = 3, // printed in one sequence
+    Mail = 4,
+    Restart = 7,
+    Other = 9,
+    Album = 10,
+};
+
+// True for an order whose pictures are printed as they are.
+constexpr bool printsAsTheyAre(OrderKind kind) {
+    return kind == OrderKind::Print || kind == OrderKind::Sequence || kind == OrderKind::Album;
+}
+
+enum class Sender : std::int16_t { Ftp = 0, Http = 1 };
+
+enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
+
+// In which form the files of an order travel.
+enum class Travel : std::int16_t { Whole = 0, Pieces = 1 };
+
 struct TransferState {
-    QString OrderFolder;             // full drive path of the order's folder
-    QString OrderLogBase;            // path of the order log without ".txt"
-    QString ShemTikiya;              // leaf name of the order folder, also its name on the server
-    std::int16_t HazmanaP = 0;       // above 0: the folder's name ends in "P"
-    std::int16_t SugSheliach = 0;    // sender: 0 FTP, 1 HTTP
-    std::int16_t SugMishloah = 0;    // 0 a new order, 1 a resend, 2 a chain
-    std::int16_t Mefurak = 0;        // 1: the order travels as pieces
+    QString OrderFolder;       // full drive path of the order's folder
+    QString OrderLogBase;      // path of the order log without ".txt"
+    QString ShemTikiya;        // leaf name of the order folder, also its name on the server
+    std::int16_t HazmanaP = 0; // above 0: the folder's name ends in "P"
+    Sender SugSheliach = Sender::Ftp;
+    Sending SugMishloah = Sending::NewOrder;
+    Travel Mefurak = Travel::Whole;
     std::int16_t KeSherLaSharat = 0; // three values that the order log carries and nothing sets
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;
@@ -172,8 +196,8 @@ struct HandOver {
 };
 
 struct SessionState {
-    QString DiskRoot;                              // "C:\", root of all workspace paths
-    std::int16_t Optint = 0;                       // order mode: 1, 2, 3, 4, 7, 9 or 10
+    QString DiskRoot; // "C:\", root of all workspace paths
+    OrderKind Optint = OrderKind::NotChosen;
     QString MisparHazmana = QStringLiteral("100"); // number of the order being built
     QString KodMishloach = QStringLiteral("   ");  // how the order started, three characters
     QString KodMishloachMakor = QStringLiteral("   ");

@@ -1,6 +1,12 @@
 #include "session/TextList.h"
 
+#include "session/Controls.h"
+
 namespace lumora {
+
+TextList::TextList(Controls& page, const char16_t* name) {
+    page.m_entries.push_back({QString::fromUtf16(name), nullptr, this});
+}
 
 void TextList::clear() {
     m_items.clear();

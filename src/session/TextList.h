@@ -5,11 +5,17 @@
 
 namespace lumora {
 
+class Controls;
+
 // A page's list of texts with a current index, the carrier of every working collection. The index rules are those that
 // the paging relies on: clearing gives -1, removing the current item gives -1, removing below it lowers it by one,
 // inserting at or below it raises it by one, and appending never moves it. An item out of range reads as an empty text.
 class TextList {
 public:
+    TextList() = default;
+    // A list of a page, entered under its design name.
+    TextList(Controls& page, const char16_t* name);
+
     void clear();
     void append(const QString& text) { m_items.append(text); }
     void append(const QStringList& texts) { m_items.append(texts); }

@@ -206,12 +206,11 @@ void hatchala::handOver() {
         timer->stop();
     m_leaving = true;
     m_state.handOver.pressStart = false;
-    m_chain.show(PageId::nnn);
-    m_chain.unload(PageId::hatchala);
+    m_chain.follow(PageId::hatchala, Outcome::OrderBegun);
 }
 
 void hatchala::Command1_Click() {
-    m_chain.show(PageId::FtpFrm);
+    m_chain.follow(PageId::hatchala, Outcome::SendingWanted);
 }
 
 void hatchala::Image3_MouseDown() {

@@ -202,7 +202,7 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
           Case{1, true, {jpg}, false, PageId::hatchala, true}, Case{1, false, {jpg}, false, PageId::hatchala, true},
           Case{1, false, {jpg}, true, PageId::UploadForm, false}}) {
         state.MisparHazmana = QString::number(++number);
-        state.transfer.SugSheliach = static_cast<std::int16_t>(c.sender);
+        state.transfer.SugSheliach = static_cast<Sender>(c.sender);
         state.TachanaMekomit = c.local;
         state.handOver.notice.clear();
         machine.dialogs.messages.clear();

@@ -32,7 +32,7 @@ inline const Changes both = toned + redEyesCorrected;
 class PreparingAnEditedOrder : public PreparingAPlainOrder {
 protected:
     PreparingAnEditedOrder() {
-        state.Optint = 2;
+        state.Optint = OrderKind::EditedPrint;
         registerPage<B3>(PageId::B3);
         registerPage<gdisave>(PageId::gdisave);
         for (const char* path : {"C:\\2000lumora", "C:\\2000lumora\\zmany", "C:\\2000lumora\\zmany\\tempred"})

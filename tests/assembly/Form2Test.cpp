@@ -45,7 +45,7 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(state.shemot.TotalPics, 13);
     EXPECT_EQ(state.transfer.OrderFolder, folder());
     EXPECT_EQ(state.transfer.OrderLogBase + u".txt"_s, logPath());
-    EXPECT_EQ(state.transfer.SugMishloah, 0) << "a resend before does not leak into a new order";
+    EXPECT_EQ(state.transfer.SugMishloah, Sending::NewOrder) << "a resend before does not leak into a new order";
     EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\^^^.jpg"_s)) << "stays for the next step to replace";
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::Form2), nullptr);
@@ -212,7 +212,7 @@ TEST_F(PreparingAPlainOrder, keepsTheOrderAtALocalStationAndTellsItsNumberOnTheS
 TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) {
     registerBare({PageId::MoogMeret});
     state.TmunatPaar = 1;
-    state.Optint = 3;
+    state.Optint = OrderKind::Sequence;
     openWith({line(givePicture(u"one.jpg"_s))}).Command6_Click();
     EXPECT_EQ(front(), PageId::MoogMeret);
     EXPECT_EQ(state.handOver.lines, QStringList(state.transfer.OrderLogBase));
@@ -266,7 +266,7 @@ TEST_F(PreparingAPlainOrder, saysItsTextsInTheLanguageOfTheSession) {
 class PreparingAnAlbum : public PreparingAPlainOrder {
 protected:
     PreparingAnAlbum() {
-        state.Optint = 10;
+        state.Optint = OrderKind::Album;
         state.DchisaAmoka = 1;
         state.shemot.n1 = state.shemot.n2 = QString();
         state.shemot.ppr = u"30/60"_s;

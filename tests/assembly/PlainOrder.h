@@ -27,11 +27,11 @@ protected:
     PreparingAPlainOrder() {
         state = exampleOrder();
         state.DiskRoot = machine.drives.programRoot();
-        state.Optint = 1;
+        state.Optint = OrderKind::Print;
         state.shemot.TotalPics = 0;
         state.profile.JppBase = 30;
         state.profile.JppChunks = 56;
-        state.transfer.SugMishloah = 1;
+        state.transfer.SugMishloah = Sending::Resend;
         registerBare({PageId::hatchala, PageId::FtpFrm});
         registerPage<Form2>(PageId::Form2);
         makeFolder(u"C:\\vedron"_s);

@@ -23,7 +23,7 @@ inline const QString standing = u"C:\\p\\standing.jpg"_s;
 class TheEditor : public testing::Test, protected PageRig {
 protected:
     TheEditor() {
-        state.Optint = 2;
+        state.Optint = OrderKind::EditedPrint;
         state.shemot.ppr = u"10/15"_s;
         state.shemot.Bord = u"NB"_s;
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());

@@ -50,7 +50,7 @@ TEST_F(SavingPictures, theSheetsNameFollowsTheSenderAndTheStation) {
     };
     for (const Case& c : {Case{0, false, true, false}, Case{0, true, true, true}, Case{1, false, false, true},
                           Case{1, true, false, true}}) {
-        state.transfer.SugSheliach = c.sender;
+        state.transfer.SugSheliach = static_cast<Sender>(c.sender);
         state.TachanaMekomit = c.station;
         page().Command6_Click();
         EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), c.jpp);

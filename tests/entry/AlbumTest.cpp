@@ -67,7 +67,7 @@ TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
     ASSERT_EQ(chain.front()->id(), PageId::kyoskNew) << qPrintable(machine.dialogs.messages.join(u'\n'));
     EXPECT_EQ(chain.find(PageId::nnn), nullptr);
     EXPECT_TRUE(state.ModulRezef);
-    EXPECT_EQ(state.Optint, 10);
+    EXPECT_EQ(state.Optint, OrderKind::Album);
     EXPECT_EQ(state.shemot.ppr, u"30/60");
     EXPECT_EQ(state.shemot.maat, u"M");
     EXPECT_EQ(state.shemot.Bord, u"NB");

@@ -31,15 +31,16 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_TRUE(page.Image1[6].visible);
     EXPECT_FALSE(page.Image1[3].visible);
     state.transfer.HazmanaP = 1;
-    state.transfer.Mefurak = 1;
+    state.transfer.Mefurak = Travel::Pieces;
     page.Image1_Click(0);
     EXPECT_EQ(page.step, nnn::Step::Details);
     EXPECT_FALSE(page.Image1[0].visible);
     EXPECT_EQ(page.StepLine.text, u"שלב 1 מתוך 4");
-    EXPECT_EQ(state.Optint, 1);
+    EXPECT_EQ(state.Optint, OrderKind::Print);
     EXPECT_EQ(state.shemot.ser, u"1234");
     EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
-    EXPECT_EQ(state.transfer.HazmanaP + state.transfer.Mefurak, 0);
+    EXPECT_EQ(state.transfer.HazmanaP, 0);
+    EXPECT_EQ(state.transfer.Mefurak, Travel::Whole);
     EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\tempred"_s));
     EXPECT_FALSE(machine.files.folderExists(u"C:\\vedron"_s)) << "made before the pictures";
 
@@ -136,11 +137,11 @@ TEST_F(nnnTest, ATileForgetsTheChoicesOfTheOrderBefore) {
     page.Command2_Click();
     EXPECT_EQ(page.step, nnn::Step::Menu);
     page.Image1_Click(6);
-    EXPECT_EQ(state.Optint, 10);
+    EXPECT_EQ(state.Optint, OrderKind::Album);
     EXPECT_EQ(page.step, nnn::Step::Album);
     page.Image1_Click(0);
     EXPECT_FALSE(page.album.Pic4Alboom.visible);
-    EXPECT_EQ(state.Optint, 1);
+    EXPECT_EQ(state.Optint, OrderKind::Print);
     EXPECT_TRUE(state.shemot.Bord.isEmpty());
     EXPECT_EQ(state.shemot.ppr + state.shemot.maat, u"******");
     EXPECT_FALSE(page.Option1[0].checked || page.Option3[1].checked || page.Image13[9].checked || page.Check1.checked);
@@ -211,7 +212,7 @@ TEST_F(nnnTest, ForgetsTheDetailsOfACustomerWhoDidNotAskToBeRemembered) {
     page.Check1_Click(true);
     page.Command3_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew) << "the quick order goes to the pictures too";
-    EXPECT_EQ(state.Optint, 2);
+    EXPECT_EQ(state.Optint, OrderKind::EditedPrint);
     EXPECT_FALSE(machine.files.fileExists(customerStore));
 }
 
@@ -244,7 +245,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     page->Image1_Click(3);
     EXPECT_EQ(machine.dialogs.messages, QStringList({"Error getting volume information."}));
     EXPECT_EQ(page->step, nnn::Step::Menu);
-    EXPECT_EQ(state.Optint, 0);
+    EXPECT_EQ(state.Optint, OrderKind::NotChosen);
     EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_^");
     machine.volume.fails = false;
     machine.dialogs.messages.clear();
@@ -253,7 +254,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     EXPECT_EQ(page->Command10.text, u"Details from memory");
     EXPECT_EQ(page->Combo1.text, u"More Sizes");
     page->Image1_Click(4);
-    EXPECT_EQ(state.Optint, 4);
+    EXPECT_EQ(state.Optint, OrderKind::Mail);
     EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_s));
     EXPECT_EQ(chain.front()->id(), PageId::MoogMeret);
     EXPECT_EQ(chain.find(PageId::nnn), nullptr);
@@ -270,7 +271,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
 
     page = &start();
     page->Image1_Click(7);
-    EXPECT_EQ(state.Optint, 7);
+    EXPECT_EQ(state.Optint, OrderKind::Restart);
     EXPECT_EQ(chain.front()->id(), PageId::hatchala);
     page = &start();
     page->Image1_Click(5);

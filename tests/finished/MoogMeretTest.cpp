@@ -120,7 +120,7 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
         EXPECT_EQ(page.Label1.text, QString::number(c.files));
         EXPECT_EQ(page.Label5.text, QString::number(c.pictures));
         EXPECT_EQ(state.shemot.TotalPics, c.pictures);
-        EXPECT_EQ(state.transfer.Mefurak, c.Mefurak);
+        EXPECT_EQ(state.transfer.Mefurak, static_cast<Travel>(c.Mefurak));
         EXPECT_EQ(page.Label4Pieces.visible, c.Mefurak > 0);
         EXPECT_EQ(page.Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order == pieces);
     }
@@ -177,12 +177,12 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
             page.Command21_Click();
         page.File1_Click(page.File1.names().find(QString::fromLatin1(c.touched)));
         EXPECT_EQ(leaves(page.File1.mailList()).toStdString(), c.mailed);
-        state.transfer.SugMishloah = 0;
+        state.transfer.SugMishloah = Sending::NewOrder;
         page.Command4_Click();
         ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
         EXPECT_EQ(leaves(state.handOver.lines).toStdString(), c.sent.toStdString());
         EXPECT_EQ(state.handOver.lines.value(0), in(c.order, c.order + u".txt"_s));
-        EXPECT_EQ(state.transfer.SugMishloah, 1);
+        EXPECT_EQ(state.transfer.SugMishloah, Sending::Resend);
         EXPECT_EQ(chain.find(PageId::MoogMeret), nullptr);
         chain.unload(PageId::FtpFrm);
     }
@@ -191,7 +191,7 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
     page.File1_Click(page.File1.names().find(pieces + u".txt"_s));
     EXPECT_EQ(page.File1.resendList().count(in(pieces, pieces + u".txt"_s)), 1);
 
-    state.transfer.SugSheliach = 1;
+    state.transfer.SugSheliach = Sender::Http;
     state.handOver.lines.clear();
     page.Command4_Click();
     EXPECT_EQ(chain.front()->id(), PageId::UploadForm);

@@ -20,7 +20,7 @@ protected:
         state.shemot.ppr = u"10/15"_s;
         state.shemot.maat = u"מבריק"_s;
         state.shemot.Bord = u"NB"_s;
-        state.Optint = 1;
+        state.Optint = OrderKind::Print;
         registerPage<kyoskNew>(PageId::kyoskNew);
         registerBare({PageId::hatchala, PageId::Form2});
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
@@ -206,7 +206,7 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
 }
 
 TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
-    state.Optint = 3;
+    state.Optint = OrderKind::Sequence;
     kyoskNew& page = openWith(14);
     ASSERT_TRUE(page.Picture66.visible);
     page.Picture1_Click(0);
@@ -229,7 +229,7 @@ TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
 }
 
 TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
-    state.Optint = 10;
+    state.Optint = OrderKind::Album;
     state.shemot.ppr = u"30/60"_s;
     state.shemot.maat = u"M"_s;
     state.album.MailZalam = u"studio@example.com"_s;
@@ -254,7 +254,7 @@ TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
 }
 
 TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     kyoskNew& page = openWith(3);
     EXPECT_EQ(page.Picture2.guide.value(1), u"   אם לחצת על תמונה אז היא נפתחת לעריכה ");
     page.Picture1_Click(0);
@@ -286,7 +286,7 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhilePaperAndCopiesChange) {
 }
 
 TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAnew) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     registerEditor();
     kyoskNew& page = openWith(3);
     page.Picture1_Click(0);
@@ -319,7 +319,7 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
 }
 
 TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     registerEditor();
     kyoskNew& page = openWith(2);
     const auto field = [&page](EditRecord::Column column) {
@@ -360,7 +360,7 @@ TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
 }
 
 TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     registerEditor();
     kyoskNew& page = openWith(2);
     ASSERT_TRUE(machine.files.writeWhole(first, "no picture"));
@@ -374,7 +374,7 @@ TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
 }
 
 TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     registerEditor();
     registerBare({PageId::B3});
     kyoskNew& page = openWith(1);
@@ -439,7 +439,7 @@ TEST_F(ThePictures, goOnWithoutAnAddressOrBackToTheChoice) {
 }
 
 TEST_F(ThePictures, ofAnEditedOrderStayInTheBasketWhileNothingCanPrepareThem) {
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
     page.Image7_Click();
@@ -499,7 +499,7 @@ TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
     for (const auto& [mode, policy, asked, on] :
          {std::tuple{1, 2, false, 1}, {1, 1, true, 0}, {2, 1, false, 0}, {10, 2, false, 1}}) {
         static_cast<void>(machine.files.removeFile(first));
-        state.Optint = static_cast<std::int16_t>(mode);
+        state.Optint = static_cast<OrderKind>(mode);
         state.MediniyutDchisa = static_cast<std::int16_t>(policy);
         state.DchisaAmoka = 1; // of an order before
         chain.unload(PageId::kyoskNew);
@@ -516,7 +516,7 @@ TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
 
 TEST_F(ThePictures, ofAnAlbumCloseWithABoxOfTheirOwnOrAtAStationWithNone) {
     state.album.MailZalam = u"studio@example.com"_s;
-    state.Optint = 10;
+    state.Optint = OrderKind::Album;
     for (const bool local : {false, true}) {
         state.TachanaMekomit = local;
         chain.unload(PageId::kyoskNew);

@@ -24,7 +24,7 @@ public:
         state.DiskRoot = u"C:\\"_s;
         state.MisparHazmana = u"105"_s;
         state.KodMishloach = u"KUP"_s;
-        state.Optint = 1;
+        state.Optint = OrderKind::Print;
         state.transfer.OrderFolder = folder();
         ClientProfile& profile = state.profile;
         profile.FtpServer = u"192.0.2.10"_s;
@@ -87,7 +87,7 @@ public:
 
     // These files are to be sent again, as the page of finished orders asks for it.
     void takeUpAgain(const QStringList& leaves) {
-        state.transfer.SugMishloah = 1;
+        state.transfer.SugMishloah = Sending::Resend;
         for (const QString& leaf : leaves)
             state.handOver.lines += local(leaf);
     }

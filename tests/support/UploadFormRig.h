@@ -17,7 +17,7 @@ public:
         , chain(test.pump) {
         state.DiskRoot = u"C:\\"_s;
         state.transfer.OrderFolder = folder();
-        state.transfer.SugSheliach = 1;
+        state.transfer.SugSheliach = Sender::Http;
         ClientProfile& profile = state.profile;
         profile.ClientCode = u"tarvelmond"_s;
         profile.LabPhone = u"00-0000000"_s;

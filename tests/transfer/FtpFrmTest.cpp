@@ -368,7 +368,7 @@ TEST_F(FtpFrmTest, ShowsTwoBoxesWhenNoServerIsNamed) {
 }
 
 TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
-    rig.state.transfer.Mefurak = 1;
+    rig.state.transfer.Mefurak = Travel::Pieces;
     rig.write(u"a_001_002.prk"_s, "1");
     rig.write(u"a_002_002.prk"_s, "2");
     rig.send();
@@ -379,7 +379,7 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
 }
 
 TEST_F(FtpFrmTest, WithoutASheetThePutOfTheFolderItselfFails) {
-    rig.state.transfer.Mefurak = 1;
+    rig.state.transfer.Mefurak = Travel::Pieces;
     (void)rig.test.files.removeFile(FtpFrmRig::local(FtpFrmRig::sheet()));
     rig.write(u"a_001_001.prk"_s, "1");
     FtpFrm& page = rig.start();
@@ -444,7 +444,7 @@ TEST_F(FtpFrmTest, SpeaksNoHebrewOnAnEnglishPage) {
 }
 
 TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {
-    rig.state.transfer.SugMishloah = 2;
+    rig.state.transfer.SugMishloah = Sending::Chain;
     FtpFrm& page = rig.start();
     EXPECT_FALSE(page.Timer1.running());
     remote()[FtpFrmRig::first()] = rig.localFiles().at(FtpFrmRig::first());

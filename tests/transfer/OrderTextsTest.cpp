@@ -31,9 +31,9 @@ TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
     SessionState state = orderOfDana();
     EXPECT_EQ(OrderReportQuery(state), reportOfDana);
     EXPECT_EQ(DoneQuery(state), u"?t1=tarvelmond&t2=true"_s);
-    state.transfer.SugMishloah = 1;
+    state.transfer.SugMishloah = Sending::Resend;
     EXPECT_EQ(OrderReportQuery(state), reportOfDana);
-    state.transfer.SugMishloah = 2;
+    state.transfer.SugMishloah = Sending::Chain;
     EXPECT_EQ(OrderReportQuery(state), QString());
     EXPECT_EQ(DoneQuery(state), QString());
 }
@@ -117,7 +117,7 @@ TEST(OrderSummary, ShowsWhoOnlyForANewOrderAndDeliveryOnlyWhenAskedFor) {
     const QDate date(2026, 11, 21);
     EXPECT_EQ(OrderSummaryLines(state, date).join(u'|'),
               u"21/11/2026|Dana Levi|03-1234567|10/15NB מבריק|gift - | סך תמונות 13||||"_s);
-    state.transfer.SugMishloah = 1;
+    state.transfer.SugMishloah = Sending::Resend;
     state.MishloachHabaita = true;
     const QStringList resend = OrderSummaryLines(state, date);
     EXPECT_FALSE(resend.contains(u"Dana Levi"_s));

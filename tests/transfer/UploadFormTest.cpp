@@ -34,7 +34,7 @@ TEST_F(UploadFormTest, SendsEachFileOnceAndReportsOnce) {
 }
 
 TEST_F(UploadFormTest, AResendIsNotReportedAndAnOrderThatIsThereIsNotSent) {
-    rig.state.transfer.SugMishloah = 1;
+    rig.state.transfer.SugMishloah = Sending::Resend;
     rig.send();
     EXPECT_TRUE(arrived());
     EXPECT_EQ(lab.reports, QStringList());

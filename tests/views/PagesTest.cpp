@@ -164,7 +164,7 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     Walk walk(GetParam());
     SessionState& state = walk.program().state();
-    state.Optint = 2;
+    state.Optint = OrderKind::EditedPrint;
     state.shemot.ppr = u"10/15"_s;
     state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
     const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder();

@@ -21,8 +21,10 @@ namespace {
 
 struct PanelPage : Page {
     PanelPage()
-        : Page(PageId::SpltForm) {}
-    Caption Command1{.text = u"Close"_s, .hint = {}};
+        : Page(PageId::SpltForm) {
+        Command1.text = u"Close"_s;
+    }
+    Caption Command1;
     int presses = 0;
 };
 

@@ -83,9 +83,9 @@ void B3::Command5_Click() {
     if (!made)
         return;
     if (m_state.TachanaMekomit)
-        handOver({});
+        handOver(Outcome::KeptAtStation);
     else
-        handOver(m_state.transfer.SugSheliach == 1 ? PageId::UploadForm : PageId::FtpFrm);
+        handOver(m_state.transfer.SugSheliach == Sender::Http ? Outcome::PreparedForHttp : Outcome::PreparedForFtp);
 }
 
 void B3::Command2_Click() {
@@ -217,7 +217,7 @@ bool B3::BuildOrderSheet() {
         return false;
     Picture5Image = sheet.bitmap();
     Picture5.visible = true;
-    auto& save = static_cast<gdisave&>(m_chain.load(PageId::gdisave));
+    auto& save = m_chain.load<gdisave>();
     save.PicPic = Picture5Image;
     save.Command6_Click();
     return true;

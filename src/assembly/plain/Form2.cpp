@@ -85,7 +85,7 @@ void Form2::load() {
     if (takeLines())
         QTimer::singleShot(0, this, &Form2::Command3_Click);
     Command6.visible = false;
-    Command4.visible = m_state.Optint == 10;
+    Command4.visible = m_state.Optint == OrderKind::Album;
     Picture5.visible = false;
     Command5.visible = Command8.visible = false;
     setStage(Stage::Waiting);
@@ -142,13 +142,13 @@ void Form2::Command6_Click() {
     if (!made)
         return;
     if (m_state.TachanaMekomit) {
-        handOver({});
+        handOver(Outcome::KeptAtStation);
         return;
     }
-    const bool toFinishedOrders = m_state.TmunatPaar == 1 && m_state.Optint == 3;
-    if (toFinishedOrders && m_chain.isRegistered(PageId::MoogMeret))
+    const bool toFinishedOrders = m_state.TmunatPaar == 1 && m_state.Optint == OrderKind::Sequence;
+    if (toFinishedOrders && m_chain.canFollow(PageId::Form2, Outcome::PreparedForLater))
         m_state.handOver.lines = {m_state.transfer.OrderLogBase};
-    handOver(toFinishedOrders ? PageId::MoogMeret : PageId::FtpFrm);
+    handOver(toFinishedOrders ? Outcome::PreparedForLater : Outcome::PreparedForFtp);
 }
 
 void Form2::Command1_Click() {
@@ -270,7 +270,7 @@ void Form2::PackOnePicture(int index, PrintPacker& packer, Prints& prints) {
 }
 
 SheetKind Form2::sheetKind() const {
-    return m_state.Optint == 10 ? SheetKind::Album : SheetKind::Plain;
+    return m_state.Optint == OrderKind::Album ? SheetKind::Album : SheetKind::Plain;
 }
 
 bool Form2::drawSheet(SheetKind kind) {

@@ -216,7 +216,7 @@ void mikledet::Combo1_Click(int index) {
 void mikledet::CommandDone_Click() {
     stopHolding();
     Frame1.visible = false;
-    m_chain.show(PageId::tFrmNew);
+    m_chain.follow(PageId::mikledet, Outcome::EditingDone);
 }
 
 void mikledet::Image1_MouseDown() {
@@ -325,7 +325,7 @@ void mikledet::textChanged() {
 }
 
 void mikledet::commitText() {
-    static_cast<tFrmNew&>(m_chain.load(PageId::tFrmNew)).Command11_Click();
+    m_chain.load<tFrmNew>().Command11_Click();
     refresh();
 }
 

@@ -25,6 +25,8 @@ class PageChain;
 class mikledet : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::mikledet;
+
     mikledet(SessionState& state, const Platform& platform, PageChain& chain);
 
     void load() override;

@@ -17,6 +17,8 @@ namespace lumora {
 class BigPics : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::BigPics;
+
     BigPics()
         : Page(PageId::BigPics) {}
 

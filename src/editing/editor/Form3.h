@@ -16,6 +16,8 @@ class PageChain;
 class Form3 : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::Form3;
+
     Form3(const SessionState& state, const Platform& platform, PageChain& chain);
 
     void load() override;

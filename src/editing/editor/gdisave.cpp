@@ -106,9 +106,9 @@ void gdisave::Command6_Click() {
         return;
     const QString sheet =
         m_state.transfer.OrderFolder + QStringLiteral("\\!") + m_state.MisparHazmana + u'_' + m_state.shemot.ser;
-    if (m_state.transfer.SugSheliach == 0)
+    if (m_state.transfer.SugSheliach == Sender::Ftp)
         SaveJpeg(PicPic, sheet + QStringLiteral(".jpp"), 90);
-    if (m_state.transfer.SugSheliach == 1 || m_state.TachanaMekomit)
+    if (m_state.transfer.SugSheliach == Sender::Http || m_state.TachanaMekomit)
         SaveJpeg(PicPic, sheet + QStringLiteral(".jpg"), 90);
 }
 

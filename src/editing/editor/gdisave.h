@@ -18,6 +18,8 @@ class PageChain;
 class gdisave : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::gdisave;
+
     // Starts the drawing library and tells its status, 0 for success.
     using Starter = std::function<int()>;
 

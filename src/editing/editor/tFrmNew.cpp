@@ -70,7 +70,7 @@ EditFields& tFrmNew::edit() const {
 }
 
 BigPics& tFrmNew::surfaces() const {
-    return static_cast<BigPics&>(m_chain.load(PageId::BigPics));
+    return m_chain.load<BigPics>();
 }
 
 EditedPreview* tFrmNew::workPicture() const {
@@ -201,7 +201,7 @@ void tFrmNew::CommandDone_Click() {
     if (m_chain.find(PageId::mikledet) != nullptr)
         m_chain.unload(PageId::mikledet);
     Q_EMIT left();
-    m_chain.show(PageId::kyoskNew);
+    m_chain.follow(PageId::tFrmNew, Outcome::EditingDone);
 }
 
 // --- the record ---

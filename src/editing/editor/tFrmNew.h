@@ -39,6 +39,8 @@ struct SessionState;
 class tFrmNew : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::tFrmNew;
+
     tFrmNew(SessionState& state, const Platform& platform, PageChain& chain);
     ~tFrmNew() override;
 

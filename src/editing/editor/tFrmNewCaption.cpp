@@ -23,10 +23,10 @@ void tFrmNew::Command8_Click() {
         fields.TextOn = 1;
         PlaceTextLabel();
     }
-    auto& keyboard = static_cast<mikledet&>(m_chain.load(PageId::mikledet));
+    auto& keyboard = m_chain.load<mikledet>();
     keyboard.Text1.text = fields.TextBody;
     keyboard.Check4.checked = fields.TextOn == 1;
-    m_chain.show(PageId::mikledet);
+    m_chain.follow(PageId::tFrmNew, Outcome::CaptionWanted);
     Q_EMIT changed();
 }
 

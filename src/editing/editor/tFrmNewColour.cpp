@@ -45,7 +45,7 @@ void tFrmNew::Image2_Click(int index) {
         return;
     case redEye:
         stopHolds();
-        static_cast<RedI&>(m_chain.load(PageId::RedI)).open(fields.PicturePath);
+        m_chain.load<RedI>().open(fields.PicturePath);
         return;
     case addRed:
         setGains(EditStep::gain(fields.GainR, colourStep), fields.GainG, EditStep::gain(fields.GainB, -colourStep));

@@ -71,7 +71,7 @@ void RedI::open(const QString& path) {
     m_step = Step::FindEye;
     caption = notChosen;
     waitFor(m_state.wording(u"התמונה נפתחת, רגע אחד…"_s, u"Opening the picture, one moment…"_s));
-    m_chain.show(PageId::RedI);
+    m_chain.follow(PageId::tFrmNew, Outcome::RedEyesWanted);
     m_platform.pump.pump(); // so that the page is seen before the reading begins
 
     struct Opened {
@@ -366,7 +366,7 @@ void RedI::Image8_Click() {
             return;
         }
         m_state.edit.RedMarker = EditRecord::corrected;
-        static_cast<tFrmNew&>(m_chain.load(PageId::tFrmNew)).Command5_Click();
+        m_chain.load<tFrmNew>().Command5_Click();
     }
     close();
 }

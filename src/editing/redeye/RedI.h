@@ -36,6 +36,8 @@ class PageChain;
 class RedI : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::RedI;
+
     RedI(SessionState& state, const Platform& platform, PageChain& chain);
     ~RedI() override;
 

@@ -53,7 +53,7 @@ void takeAlbumOrder(SessionState& state) {
     QString& extra = state.album.Tosafot1[0];
     if (extra == albumPrompt(AlbumChoice::Extra, state.english()))
         extra.clear();
-    state.Optint = 10;
+    state.Optint = OrderKind::Album;
     state.shemot.ppr = state.album.GodelLBM;
     state.shemot.FillFit = QStringLiteral("FFF");
     state.shemot.Bord = QStringLiteral("NB");

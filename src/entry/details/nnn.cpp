@@ -72,7 +72,7 @@ void nnn::Image1_Click(int tile) {
             break;
         markedTile = tile;
         clearChoices();
-        m_state.Optint = static_cast<std::int16_t>(tile + 1);
+        m_state.Optint = static_cast<OrderKind>(tile + 1);
         m_state.ModulRezef = tile == SequenceTile;
         open(Step::Details);
         focusOn(QStringLiteral("Text2"));
@@ -81,39 +81,34 @@ void nnn::Image1_Click(int tile) {
         if (!ready)
             break;
         clearChoices();
-        m_state.Optint = 4;
+        m_state.Optint = OrderKind::Mail;
         if (!prepareOrder())
             break;
-        if (m_chain.show(PageId::MoogMeret)) {
+        if (m_chain.follow(PageId::nnn, Outcome::FinishedWanted))
             m_leaving = true;
-            m_chain.unload(PageId::nnn);
-        }
         break;
     case AlbumTile:
         if (!ready)
             break;
         clearChoices();
-        m_state.Optint = 10;
+        m_state.Optint = OrderKind::Album;
         album.begin();
         open(Step::Album);
         break;
     case RestartTile:
-        m_state.Optint = 7;
+        m_state.Optint = OrderKind::Restart;
         m_leaving = true;
-        m_chain.show(PageId::hatchala);
-        m_chain.unload(PageId::nnn);
+        m_chain.follow(PageId::nnn, Outcome::NewOrderWanted);
         break;
     case EnglishTile:
         m_state.EnglishTips = 1;
         Command5_Click();
         break;
     case OtherTile:
-        m_state.Optint = 9;
-        if (m_chain.show(PageId::Havharot)) {
-            if (auto* notice = dynamic_cast<Havharot*>(m_chain.find(PageId::Havharot)))
-                notice->showPlain();
+        m_state.Optint = OrderKind::Other;
+        if (m_chain.follow(PageId::nnn, Outcome::NoticeAlone)) {
+            m_chain.load<Havharot>().showPlain();
             m_leaving = true;
-            m_chain.unload(PageId::nnn);
         }
         break;
     default:
@@ -133,7 +128,7 @@ bool nnn::beginTile() {
     m_state.shemot.TimeOfJob = BuildTimeOfJob(m_platform.clock.now().date(), m_state.KodMishloach, m_state.shemot.ser);
     // A resend before must not leak into a new order.
     m_state.transfer.HazmanaP = 0;
-    m_state.transfer.Mefurak = 0;
+    m_state.transfer.Mefurak = Travel::Whole;
     m_state.transfer.MailFlag = 0;
     const Result<void> made = Workspace(m_state, m_platform.files).MakeWorkspace();
     if (!made)
@@ -312,11 +307,11 @@ void nnn::Option5_Click() {
 }
 
 bool nnn::asksBorder() const {
-    return (m_state.Optint == 1 || m_state.Optint == 3) && m_state.GvulMuzag == 1;
+    return (m_state.Optint == OrderKind::Print || m_state.Optint == OrderKind::Sequence) && m_state.GvulMuzag == 1;
 }
 
 bool nnn::asksFit() const {
-    return (m_state.Optint == 1 || m_state.Optint == 3) && m_state.FitMuzag;
+    return (m_state.Optint == OrderKind::Print || m_state.Optint == OrderKind::Sequence) && m_state.FitMuzag;
 }
 
 // --- terms, and on to the pictures ---
@@ -344,7 +339,7 @@ void nnn::Command3_Click() {
         return;
     }
     rememberOrForget();
-    if (m_state.Optint >= 1 && m_state.Optint <= 3)
+    if (m_state.Optint >= OrderKind::Print && m_state.Optint <= OrderKind::Sequence)
         GoToSelection();
 }
 
@@ -365,7 +360,7 @@ void nnn::takeAlbum() {
 void nnn::Command24_Click() {
     if (m_leaving || !termsAgreed(album.Check6))
         return;
-    m_state.Optint = 10;
+    m_state.Optint = OrderKind::Album;
     m_state.ModulRezef = true;
     if (beginTile())
         GoToSelection();
@@ -419,10 +414,8 @@ void nnn::GoToSelection() {
     if (!prepareOrder())
         return;
     m_leaving = true;
-    if (m_chain.show(PageId::kyoskNew)) {
-        m_chain.unload(PageId::nnn);
+    if (m_chain.follow(PageId::nnn, Outcome::PicturesWanted))
         return;
-    }
     m_leaving = false;
     tell(QStringLiteral("דף בחירת התמונות עדיין אינו זמין בגרסה זו"),
          QStringLiteral("The page for choosing pictures is not yet available in this version"));
@@ -443,7 +436,7 @@ void nnn::QuickCheck() {
         if (const Result<void> gone = DetailStore(m_state, m_platform.files).forgetQuickDetails(); !gone)
             m_platform.dialogs.message(gone.failure().message);
     }
-    m_state.Optint = 2;
+    m_state.Optint = OrderKind::EditedPrint;
     GoToSelection();
 }
 
@@ -506,7 +499,7 @@ void nnn::Command9_Click() {
 }
 
 void nnn::Command15_Click() {
-    m_chain.show(PageId::Havharot);
+    m_chain.follow(PageId::nnn, Outcome::NoticeWanted);
 }
 
 void nnn::focusOn(const QString& box) {

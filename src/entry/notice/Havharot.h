@@ -14,6 +14,8 @@ struct SessionState;
 class Havharot : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::Havharot;
+
     Havharot(SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;

@@ -39,9 +39,10 @@ void FilesToSend::turnMark(int index) {
         m_marked[static_cast<std::size_t>(index)].flip();
 }
 
-void FilesToSend::markAll(std::int16_t Mefurak) {
+void FilesToSend::markAll(Travel Mefurak) {
     for (int i = 0; i < m_names.count(); ++i)
-        m_marked[static_cast<std::size_t>(i)] = Mefurak <= 0 || IsPiece(m_names.item(i)) || IsSheet(m_names.item(i));
+        m_marked[static_cast<std::size_t>(i)] =
+            Mefurak == Travel::Whole || IsPiece(m_names.item(i)) || IsSheet(m_names.item(i));
 }
 
 QStringList FilesToSend::markedNames() const {

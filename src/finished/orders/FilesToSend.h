@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/files/Files.h"
+#include "session/SessionState.h"
 #include "session/TextList.h"
 
 #include <cstdint>
@@ -31,8 +32,8 @@ public:
 
     // An index out of range does nothing.
     void turnMark(int index);
-    // With Mefurak above 0 only pieces and the sheet, whose name begins with "!", are marked.
-    void markAll(std::int16_t Mefurak);
+    // Of an order in pieces only those and the sheet, whose name begins with "!", are marked.
+    void markAll(Travel Mefurak);
 
     // Pictures in the marked files, told by the first two characters of each name; texts hold none.
     std::int16_t familyCount() const;

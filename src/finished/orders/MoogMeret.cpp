@@ -128,7 +128,7 @@ void MoogMeret::List3_Click(int index) {
     m_state.transfer.OrderFolder = folder;
     // Neither is set back by a later folder: the lab's people may send what an order in pieces came from.
     if (TravelsInPieces(List3.currentItem())) {
-        m_state.transfer.Mefurak = 1;
+        m_state.transfer.Mefurak = Travel::Pieces;
         File1.setPattern(FilesToSend::withPieces);
     }
     File1.setFolder(folder);
@@ -142,7 +142,7 @@ void MoogMeret::List3_Click(int index) {
 void MoogMeret::showOrder(const QString& folder) {
     Label1.text = QString::number(File1.names().count());
     Label4Reka.visible = File1.names().isEmpty();
-    Label4Pieces.visible = m_state.transfer.Mefurak > 0;
+    Label4Pieces.visible = m_state.transfer.Mefurak == Travel::Pieces;
     showWhatIsMarked();
     const OrderDetails details = detailsOf(folder);
     const QString customer = QString(details.n1 + u' ' + details.n2).trimmed();
@@ -231,13 +231,12 @@ void MoogMeret::Command4_Click() {
         return;
     }
     m_leaving = true;
-    m_state.transfer.SugMishloah = 1;
+    m_state.transfer.SugMishloah = Sending::Resend;
     m_state.transfer.OrderFolder = File1.folder();
-    const bool byHttp = m_state.transfer.SugSheliach == 1;
+    const bool byHttp = m_state.transfer.SugSheliach == Sender::Http;
     if (!byHttp)
         m_state.handOver.lines = List1.items();
-    m_chain.show(byHttp ? PageId::UploadForm : PageId::FtpFrm);
-    m_chain.unload(PageId::MoogMeret);
+    m_chain.follow(PageId::MoogMeret, byHttp ? Outcome::ResentByHttp : Outcome::ResentByFtp);
 }
 
 void MoogMeret::Command6_Click() {
@@ -254,8 +253,7 @@ void MoogMeret::Command28_Click() {
     if (m_leaving || m_sending || m_walking)
         return;
     m_leaving = true;
-    m_chain.show(PageId::hatchala);
-    m_chain.unload(PageId::MoogMeret);
+    m_chain.follow(PageId::MoogMeret, Outcome::NewOrderWanted);
 }
 
 void MoogMeret::Command4Orders_Click() {
@@ -265,7 +263,7 @@ void MoogMeret::Command4Orders_Click() {
 // It leads back here.
 void MoogMeret::Command4Pieces_Click() {
     if (!m_leaving && !m_sending && !m_walking)
-        m_chain.show(PageId::SpltForm);
+        m_chain.follow(PageId::MoogMeret, Outcome::PiecesWanted);
 }
 
 void MoogMeret::leaveProgram() {

@@ -339,8 +339,7 @@ void SpltForm::Image3_Click() {
 }
 
 void SpltForm::leave() {
-    m_chain.show(PageId::MoogMeret);
-    m_chain.unload(PageId::SpltForm);
+    m_chain.follow(PageId::SpltForm, lumora::Outcome::PiecesDone);
 }
 
 bool SpltForm::segmentIsRight() {

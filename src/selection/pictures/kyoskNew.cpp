@@ -20,7 +20,7 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
 kyoskNew::~kyoskNew() = default;
 
 bool kyoskNew::plain() const {
-    return isPlainMode(m_state.Optint);
+    return printsAsTheyAre(m_state.Optint);
 }
 
 void kyoskNew::load() {
@@ -35,7 +35,7 @@ void kyoskNew::load() {
                             &Frame3, &PicB4Sioom, &Frame4, &Pic4snifim, &Pic4Snif, &Picture7, &Txt4Ml2, &Label24})
         hidden->visible = false;
     // An album order has a finish of its own, until the whole folder is taken.
-    Image13.visible = m_state.Optint == 10;
+    Image13.visible = m_state.Optint == OrderKind::Album;
     Image7.visible = !Image13.visible;
     const bool coupon = m_state.coupon.HaKoopon == 1;
     for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3, &Label4kpn3Prompt})

@@ -16,6 +16,7 @@
 namespace lumora {
 
 class PageChain;
+enum class Outcome;
 struct Platform;
 struct SessionState;
 class tFrmNew;
@@ -250,7 +251,7 @@ private:
     void HandToPreparation();
     void HandToSecondPage();
     void HandToSecondPageNoMail();
-    bool handTo(PageId next);
+    bool handTo(Outcome chosen);
     QString noteOfOrder() const;
     void openBranches();
     void ShowBranchCard();

@@ -86,7 +86,7 @@ void kyoskNew::AddForEditor(int cell) {
 }
 
 tFrmNew* kyoskNew::editor() const {
-    return static_cast<tFrmNew*>(m_chain.find(PageId::tFrmNew));
+    return m_chain.find<tFrmNew>();
 }
 
 // Once an order, with this page.
@@ -108,7 +108,7 @@ void kyoskNew::openInEditor(int cell) {
         return; // it was told; the picture stays in the basket as it was
     Command13[static_cast<std::size_t>(cell)].colour = KeyColour::Orange;
     editorView.visible = true;
-    m_chain.show(PageId::tFrmNew);
+    m_chain.follow(PageId::kyoskNew, Outcome::EditorWanted);
 }
 
 // What is in hand is let go and packed before another picture's fields take the place of these: a zoom that is still

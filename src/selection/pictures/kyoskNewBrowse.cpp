@@ -125,7 +125,7 @@ void kyoskNew::showFolderOf(const QString& picture) {
     if (List4.isEmpty())
         return;
     Frame1.visible = true;
-    if (m_state.Optint == 3 || m_state.Optint == 10)
+    if (m_state.Optint == OrderKind::Sequence || m_state.Optint == OrderKind::Album)
         showFolderOffer();
     showGuide(Guide::PicturesShown);
     ShowPage();
@@ -294,8 +294,8 @@ void kyoskNew::Image4_Click() {
 void kyoskNew::Picture2_Click() {
     if (Picture2.bitmap.isNull())
         return;
-    static_cast<Form3&>(m_chain.load(PageId::Form3)).showPicture(Label2.text);
-    m_chain.show(PageId::Form3);
+    m_chain.load<Form3>().showPicture(Label2.text);
+    m_chain.follow(PageId::kyoskNew, Outcome::TurnedWanted);
 }
 
 void kyoskNew::Image6_Click() {

@@ -80,7 +80,7 @@ void kyoskNew::FinishSimple() {
     Picture7.visible = deep == DeepCompression::Ask;
     if (!openClosingPanel())
         return;
-    const bool album = m_state.Optint == 10;
+    const bool album = m_state.Optint == OrderKind::Album;
     const bool asksAddress = !m_state.TachanaMekomit;
     Text1.visible = asksAddress && !album;
     Combo1.visible = asksAddress && !album;
@@ -214,7 +214,7 @@ void kyoskNew::Command10_Click() {
 }
 
 void kyoskNew::HandToPreparation() {
-    if (handTo(PageId::B3) || m_chain.isRegistered(PageId::B3))
+    if (handTo(Outcome::EditedChosen) || m_chain.canFollow(PageId::kyoskNew, Outcome::EditedChosen))
         return;
     say(QStringLiteral("הכנת הזמנה עם עריכת תמונות אינה זמינה בגרסה זו\nהתמונות שבחרת נשארו בסל"),
         QStringLiteral("This version can't prepare an order of edited pictures yet\n"
@@ -224,19 +224,19 @@ void kyoskNew::HandToPreparation() {
 void kyoskNew::HandToSecondPage() {
     m_state.shemot.Hearot = noteOfOrder();
     // The address of an album order is known already.
-    m_state.shemot.Mail = m_state.Optint == 10 ? Txt4Ml2.text : Text1.text + u'@' + Combo1.text;
-    handTo(PageId::Form2);
+    m_state.shemot.Mail = m_state.Optint == OrderKind::Album ? Txt4Ml2.text : Text1.text + u'@' + Combo1.text;
+    handTo(Outcome::PlainChosen);
 }
 
 void kyoskNew::HandToSecondPageNoMail() {
     m_state.shemot.Hearot = noteOfOrder();
     m_state.shemot.Mail = QStringLiteral("לא הוקלד");
-    handTo(PageId::Form2);
+    handTo(Outcome::PlainChosen);
 }
 
 // Once: a second press that arrives while the page yields finds the basket on its way.
-bool kyoskNew::handTo(PageId next) {
-    if (m_handedOver || !m_chain.isRegistered(next))
+bool kyoskNew::handTo(Outcome chosen) {
+    if (m_handedOver || !m_chain.canFollow(PageId::kyoskNew, chosen))
         return false;
     m_handedOver = true;
     leaveEditor(); // a picture that is still open there
@@ -245,13 +245,12 @@ bool kyoskNew::handTo(PageId next) {
     Timer2.stop();
     m_platform.pump.pump();
     m_state.handOver.lines = List1.lines().items();
-    m_state.handOver.pressStart = next == PageId::Form2;
-    if (!m_chain.show(next))
+    m_state.handOver.pressStart = chosen == Outcome::PlainChosen;
+    if (!m_chain.follow(PageId::kyoskNew, chosen))
         return false;
     // The next order begins with an editor of its own.
     for (const PageId id : {PageId::mikledet, PageId::RedI, PageId::Form3, PageId::tFrmNew, PageId::BigPics})
         m_chain.unload(id);
-    m_chain.unload(PageId::kyoskNew);
     return true;
 }
 

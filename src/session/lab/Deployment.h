@@ -13,7 +13,7 @@ struct Deployment {
     // empty here. AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
     ClientProfile profile;
 
-    std::int16_t SugSheliach = 0;
+    Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;
     bool TachanaMekomit = false;

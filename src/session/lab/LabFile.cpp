@@ -219,7 +219,8 @@ std::vector<Key> addressAndSwitchKeys() {
              return true;
          }},
         {switches, QStringLiteral("Sender"), QStringLiteral("ftp or http"),
-         wordOf<I>(&D::SugSheliach, {{QStringLiteral("ftp"), 0}, {QStringLiteral("http"), 1}})},
+         wordOf<Sender>(&D::SugSheliach,
+                        {{QStringLiteral("ftp"), Sender::Ftp}, {QStringLiteral("http"), Sender::Http}})},
         {switches, QStringLiteral("Coupon"), yesOrNo, yesNo<I>(&D::HaKoopon, 1, 0)},
         {switches, QStringLiteral("DeliveryQuestion"), yesOrNo, yesNo<I>(&D::DeliveryChoiceMode, 1, 0)},
         {switches, QStringLiteral("LocalStation"), yesOrNo, yesNo(&D::TachanaMekomit, true, false)},
@@ -348,7 +349,7 @@ private:
     // nowhere.
     void checkTogether() {
         const ClientProfile& profile = m_reading.deployment.profile;
-        if (m_reading.deployment.SugSheliach == 1)
+        if (m_reading.deployment.SugSheliach == Sender::Http)
             checkFilled(QStringLiteral("Switches.Sender"), QStringLiteral("http"), QStringLiteral("Addresses"),
                         {{QStringLiteral("HttpHost"), profile.HttpHost},
                          {QStringLiteral("HttpTikiya"), profile.HttpTikiya},

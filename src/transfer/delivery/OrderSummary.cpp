@@ -17,7 +17,7 @@ constexpr int letterHeight = 14;
 
 QStringList OrderSummaryLines(const SessionState& state, const QDate& date) {
     QStringList lines{date.toString(QStringLiteral("dd/MM/yyyy"))};
-    if (state.transfer.SugMishloah == 1)
+    if (state.transfer.SugMishloah == Sending::Resend)
         lines += {state.wording(QStringLiteral(" משלוח חוזר "), QStringLiteral(" Resend ")),
                   state.wording(QStringLiteral(" כדי לראות פרטי הזמנה לחץ על "),
                                 QStringLiteral(" To see the order's details press ")),

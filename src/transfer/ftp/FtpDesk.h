@@ -25,7 +25,7 @@ struct FtpDesk {
     QString wording(const QString& hebrew, const QString& inEnglish) const { return state.wording(hebrew, inEnglish); }
 
     // True when the files travel as they are and not as pieces; pieces keep the status line and the caption quiet.
-    bool wholeFiles() const { return state.transfer.Mefurak < 1; }
+    bool wholeFiles() const { return state.transfer.Mefurak == Travel::Whole; }
 
     void status(const QString& text) {
         board.Label3.text = text;

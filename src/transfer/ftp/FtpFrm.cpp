@@ -52,9 +52,9 @@ void FtpFrm::load() {
     Command10.visible = false;
     Command28.visible = false;
     Command15.enabled = Command21.enabled = false;
-    Command22.visible = m_state.transfer.SugMishloah == 2;
+    Command22.visible = m_state.transfer.SugMishloah == Sending::Chain;
     Label15.visible = Label4Ktovet.visible = false;
-    Label4DiffTitle.visible = Label4Diff.visible = m_state.transfer.Mefurak > 0;
+    Label4DiffTitle.visible = Label4Diff.visible = m_state.transfer.Mefurak == Travel::Pieces;
     Label4Reason.visible = false;
     Picture1.visible = false;
     m_room->session.FtpEnableControls(false);
@@ -83,9 +83,9 @@ void FtpFrm::Form_Activate() {
     m_room->session.PauseBar(3);
     if (m_room->desk.left)
         return;
-    if (m_state.transfer.SugMishloah == 0)
+    if (m_state.transfer.SugMishloah == Sending::NewOrder)
         Command13_Click();
-    else if (m_state.transfer.SugMishloah == 1)
+    else if (m_state.transfer.SugMishloah == Sending::Resend)
         Command1_Click();
     else
         enter(Phase::NoOrder);
@@ -375,8 +375,7 @@ void FtpFrm::Command8_Click() {
 void FtpFrm::Command28_Click() {
     if (sending)
         return;
-    m_chain.show(PageId::hatchala);
-    m_chain.unload(PageId::FtpFrm);
+    m_chain.follow(PageId::FtpFrm, Outcome::NewOrderWanted);
 }
 
 void FtpFrm::Image4_Click() {

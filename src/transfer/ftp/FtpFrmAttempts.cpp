@@ -152,7 +152,7 @@ void FtpFrm::SendSuccess() {
     m_room->desk.captionFollowsStatus();
     m_room->desk.pump();
     if (m_state.profile.ReportOn > 0 && m_chain.isRegistered(PageId::InetForm)) {
-        auto& reports = static_cast<InetForm&>(m_chain.load(PageId::InetForm));
+        auto& reports = m_chain.load<InetForm>();
         reports.Command1_Click();
         reports.Command2_Click();
     }

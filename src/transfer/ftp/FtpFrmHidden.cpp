@@ -28,7 +28,7 @@ void FtpFrm::Command2_Click() {
         return;
     }
     List3.clear();
-    if (m_state.transfer.Mefurak < 1) {
+    if (m_state.transfer.Mefurak == Travel::Whole) {
         List3.append(m_handedOver);
     } else {
         const auto append = [&](const QString& ending) {
@@ -287,8 +287,10 @@ void FtpFrm::ListRezefFiles_Click(int index) {
 void FtpFrm::PrepareResendHere(const QString& folder) {
     const bool pieces = TravelsInPieces(folder);
     File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
-    if (pieces)
-        m_state.transfer.Mefurak = m_state.transfer.HazmanaP = 1;
+    if (pieces) {
+        m_state.transfer.Mefurak = Travel::Pieces;
+        m_state.transfer.HazmanaP = 1;
+    }
     m_state.transfer.OrderFolder = folder;
     File1.setFolder(folder);
     File1.refresh();
@@ -298,7 +300,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
         List3.append(log);
     for (const QString& entry : File1.names()) {
         const QString path = JoinDrivePath(folder, entry);
-        const bool selected = m_state.transfer.Mefurak < 1 || IsPiece(entry) || IsSheet(entry);
+        const bool selected = m_state.transfer.Mefurak == Travel::Whole || IsPiece(entry) || IsSheet(entry);
         if (selected && path != log)
             List3.append(path);
     }
@@ -308,7 +310,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
             QStringLiteral("You chose no files to send from the yellow window.\rRead the instructions of step two.")));
         return;
     }
-    m_state.transfer.SugMishloah = 2;
+    m_state.transfer.SugMishloah = Sending::Chain;
     armCountdown();
 }
 

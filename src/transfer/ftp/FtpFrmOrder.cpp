@@ -65,7 +65,7 @@ void FtpFrm::listFolder() {
     // The order text always travels ahead of the pictures.
     if (m_platform.files.fileExists(log))
         List3.append(log);
-    if (m_state.transfer.Mefurak < 1) {
+    if (m_state.transfer.Mefurak == Travel::Whole) {
         for (const QString& name : File1.names())
             List3.append(JoinDrivePath(folder, name));
     } else {
@@ -96,9 +96,9 @@ void FtpFrm::CountOrderPictures() {
 
 void FtpFrm::ShowOrderSummary() {
     Picture2Lines = OrderSummaryLines(m_state, m_platform.clock.now().date());
-    if (m_state.transfer.SugMishloah > 1 || !m_chain.isRegistered(PageId::gdisave))
+    if (m_state.transfer.SugMishloah == Sending::Chain || !m_chain.isRegistered(PageId::gdisave))
         return;
-    auto& saver = static_cast<gdisave&>(m_chain.load(PageId::gdisave));
+    auto& saver = m_chain.load<gdisave>();
     saver.LitlPic = OrderSummaryPicture(Picture2Lines, m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     saver.Command7_Click();
 }

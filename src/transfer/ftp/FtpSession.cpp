@@ -52,7 +52,7 @@ void FtpSession::takeSettings() {
 }
 
 void FtpSession::PauseBar(int times) {
-    m_board.Picture1.visible = m_desk.state.transfer.Mefurak == 0;
+    m_board.Picture1.visible = m_desk.state.transfer.Mefurak == Travel::Whole;
     for (int time = 0; time < times; ++time) {
         for (int i = 1; i <= pauseRounds && !m_desk.left; ++i) {
             m_board.Picture1Width = i / 6;

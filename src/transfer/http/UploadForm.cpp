@@ -301,8 +301,7 @@ void UploadForm::Image5_Click() {
 void UploadForm::Command28_Click() {
     if (!idle())
         return;
-    m_chain.show(PageId::hatchala);
-    m_chain.unload(PageId::UploadForm);
+    m_chain.follow(PageId::UploadForm, Outcome::NewOrderWanted);
 }
 
 void UploadForm::Image3_Click() {

@@ -71,7 +71,7 @@ void UploadForm::finishSuccess() {
     Label1.text.clear();
     Label4Reason.visible = false;
     HttpPause(2);
-    if (m_state.transfer.SugMishloah == 0 && !m_left) {
+    if (m_state.transfer.SugMishloah == Sending::NewOrder && !m_left) {
         HttpSendReport();
         HttpPause(2);
         HttpSendDone();

@@ -14,6 +14,8 @@ struct SessionState;
 class InetForm : public Page {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::InetForm;
+
     InetForm(SessionState& state, const Platform& platform, PageChain& chain);
 
     // Events.

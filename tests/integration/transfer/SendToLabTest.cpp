@@ -159,7 +159,7 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
         rig.chain.unload(PageId::FtpFrm);
         ASSERT_TRUE(std::filesystem::remove(remoteFolder() / "000.jpg"));
         rig.state.profile.ReportOn = 1;
-        rig.state.transfer.SugMishloah = 0;
+        rig.state.transfer.SugMishloah = Sending::NewOrder;
     }
     const auto earlier = puts().size();
 

@@ -1,0 +1,45 @@
+#include "session/PageFlow.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+const std::vector<PageWay>& pageFlow() {
+    using enum PageId;
+    using enum Outcome;
+    using enum PageWay::From;
+    // An edited order goes by the sender that the lab has set; a plain one goes by FTP, always.
+    static const std::vector<PageWay> ways = {
+        {hatchala, OrderBegun, nnn, IsLeft},        {hatchala, SendingWanted, FtpFrm, Waits},
+
+        {nnn, PicturesWanted, kyoskNew, IsLeft},    {nnn, FinishedWanted, MoogMeret, IsLeft},
+        {nnn, NoticeWanted, Havharot, Waits},       {nnn, NoticeAlone, Havharot, IsLeft},
+        {nnn, NewOrderWanted, hatchala, IsLeft},
+
+        {kyoskNew, EditorWanted, tFrmNew, Waits},   {kyoskNew, TurnedWanted, Form3, Waits},
+        {kyoskNew, PlainChosen, Form2, IsLeft},     {kyoskNew, EditedChosen, B3, IsLeft},
+
+        {tFrmNew, CaptionWanted, mikledet, Waits},  {tFrmNew, RedEyesWanted, RedI, Waits},
+        {tFrmNew, EditingDone, kyoskNew, Waits},    {mikledet, EditingDone, tFrmNew, Waits},
+
+        {Form2, PreparedForFtp, FtpFrm, IsLeft},    {Form2, PreparedForLater, MoogMeret, IsLeft},
+        {Form2, KeptAtStation, hatchala, IsLeft},   {B3, PreparedForFtp, FtpFrm, IsLeft},
+        {B3, PreparedForHttp, UploadForm, IsLeft},  {B3, KeptAtStation, hatchala, IsLeft},
+
+        {FtpFrm, NewOrderWanted, hatchala, IsLeft}, {UploadForm, NewOrderWanted, hatchala, IsLeft},
+
+        {MoogMeret, ResentByFtp, FtpFrm, IsLeft},   {MoogMeret, ResentByHttp, UploadForm, IsLeft},
+        {MoogMeret, PiecesWanted, SpltForm, Waits}, {MoogMeret, NewOrderWanted, hatchala, IsLeft},
+        {SpltForm, PiecesDone, MoogMeret, IsLeft},
+    };
+    return ways;
+}
+
+std::optional<PageWay> wayFrom(PageId from, Outcome outcome) {
+    const auto& ways = pageFlow();
+    const auto at = std::find_if(ways.begin(), ways.end(),
+                                 [&](const PageWay& way) { return way.from == from && way.outcome == outcome; });
+    return at == ways.end() ? std::nullopt : std::optional(*at);
+}
+
+} // namespace lumora
