@@ -4,6 +4,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // Entries from the first one without a default on keep what they hold.
@@ -25,14 +27,14 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     setSizes(profile.SizeList, deployment.profile.SizeList, 9);
     setSizes(profile.QuickSizes, deployment.profile.QuickSizes, 2);
     if (profile.PriceListUrl.isEmpty())
-        profile.PriceListUrl = profile.SiteUrl + QStringLiteral("album_pricelist");
+        profile.PriceListUrl = profile.SiteUrl + u"album_pricelist"_s;
     profile.PriceListUrl2 = profile.PriceListUrl;
     // The site's address ends in a slash already: two slashes in a row are how these addresses read.
-    profile.AdUrl1 = profile.SiteUrl + QStringLiteral("/ad01.jpg");
-    profile.AdUrl2 = profile.SiteUrl + QStringLiteral("/ad02.jpg");
+    profile.AdUrl1 = profile.SiteUrl + u"/ad01.jpg"_s;
+    profile.AdUrl2 = profile.SiteUrl + u"/ad02.jpg"_s;
     // Without "2000" in front, unlike the workspace: an installation places these pictures.
-    profile.AdFile1 = state.DiskRoot + QStringLiteral("lumora\\zmany\\ad01.jpg");
-    profile.AdFile2 = state.DiskRoot + QStringLiteral("lumora\\zmany\\ad02.jpg");
+    profile.AdFile1 = state.DiskRoot + u"lumora\\zmany\\ad01.jpg"_s;
+    profile.AdFile2 = state.DiskRoot + u"lumora\\zmany\\ad02.jpg"_s;
     state.profile = std::move(profile);
 
     state.MediniyutDchisa = deployment.MediniyutDchisa;

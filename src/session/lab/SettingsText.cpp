@@ -5,13 +5,13 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The lab's site and all copies of the program agree on these two tables.
-const QString plainAlphabet =
-    QStringLiteral("abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ1234567890@*-_\\/+!. ^=");
-const QString permutation =
-    QStringLiteral("oC+U_Pqxd0ve67 I2DFg3A91VNlHp4ZzK5uOJmhk@nByiXrGL^EYfbR*c-Sa.\\Q!Ts/Mj=8wtW");
+const QString plainAlphabet = u"abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ1234567890@*-_\\/+!. ^="_s;
+const QString permutation = u"oC+U_Pqxd0ve67 I2DFg3A91VNlHp4ZzK5uOJmhk@nByiXrGL^EYfbR*c-Sa.\\Q!Ts/Mj=8wtW"_s;
 
 QString exchanged(const QString& text, const QString& from, const QString& to) {
     QString result;
@@ -23,7 +23,7 @@ QString exchanged(const QString& text, const QString& from, const QString& to) {
 }
 
 QString piece(const QString& key, const QString& value) {
-    return key + (value.isEmpty() ? QStringLiteral("0") : value) + u'^';
+    return key + (value.isEmpty() ? u"0"_s : value) + u'^';
 }
 
 struct CardField {
@@ -32,41 +32,40 @@ struct CardField {
 };
 
 const std::vector<CardField> cardFields = {
-    {QStringLiteral("FileDtt"), QString()},
-    {QStringLiteral("HaeemHaytaSisma"), QString()},
-    {QStringLiteral("DayOfOrder"), QStringLiteral("  תאריך הזמנה  ")},
-    {QStringLiteral("MisparHazmanaZo"), QStringLiteral(" מספר הזמנה ")},
-    {QStringLiteral("ShemHamazmin"), QStringLiteral("  שם המזמין  ")},
-    {QStringLiteral("MisparHakartis"), QStringLiteral("   מספר כרטיס   ")},
-    {QStringLiteral("GodeDaf"), QStringLiteral("   גודל דף   ")},
-    {QStringLiteral("TotalPicsBeHazmanaZo"), QStringLiteral("   כמות תמונות בהזמנה  ")},
-    {QStringLiteral("MachpeelLeHiyoov"), QString()},
-    {QStringLiteral("Mor"), QString()},
-    {QStringLiteral("Prise4Daf"), QString()},
-    {QStringLiteral("QamootTmoonotLeHiyoov"), QString()},
-    {QStringLiteral("ShemBaalHacrtis"), QString()},
-    {QStringLiteral("YetraKodemet"), QString()},
+    {u"FileDtt"_s, QString()},
+    {u"HaeemHaytaSisma"_s, QString()},
+    {u"DayOfOrder"_s, u"  תאריך הזמנה  "_s},
+    {u"MisparHazmanaZo"_s, u" מספר הזמנה "_s},
+    {u"ShemHamazmin"_s, u"  שם המזמין  "_s},
+    {u"MisparHakartis"_s, u"   מספר כרטיס   "_s},
+    {u"GodeDaf"_s, u"   גודל דף   "_s},
+    {u"TotalPicsBeHazmanaZo"_s, u"   כמות תמונות בהזמנה  "_s},
+    {u"MachpeelLeHiyoov"_s, QString()},
+    {u"Mor"_s, QString()},
+    {u"Prise4Daf"_s, QString()},
+    {u"QamootTmoonotLeHiyoov"_s, QString()},
+    {u"ShemBaalHacrtis"_s, QString()},
+    {u"YetraKodemet"_s, QString()},
 };
 
 } // namespace
 
 QString SettingsText(const ClientProfile& profile) {
     // The first piece is written twice: a reader drops it from its list.
-    QString text =
-        piece(QStringLiteral("TK1="), profile.FtpFolder1) + piece(QStringLiteral("TK1="), profile.FtpFolder1) +
-        piece(QStringLiteral("TK2="), profile.FtpFolder2) + piece(QStringLiteral("ASP="), profile.ClientCode) +
-        piece(QStringLiteral("SRT="), profile.FtpServer) + piece(QStringLiteral("PAS="), profile.FtpPassword) +
-        piece(QStringLiteral("USR="), profile.FtpUser) + piece(QStringLiteral("SRK="), profile.ServerKey) +
-        piece(QStringLiteral("STY="), QString::number(profile.JppBase)) +
-        piece(QStringLiteral("MNA="), QString::number(profile.JppChunks)) +
-        piece(QStringLiteral("ZPN="), QString::number(profile.ProfileNumber));
+    QString text = piece(u"TK1="_s, profile.FtpFolder1) + piece(u"TK1="_s, profile.FtpFolder1) +
+                   piece(u"TK2="_s, profile.FtpFolder2) + piece(u"ASP="_s, profile.ClientCode) +
+                   piece(u"SRT="_s, profile.FtpServer) + piece(u"PAS="_s, profile.FtpPassword) +
+                   piece(u"USR="_s, profile.FtpUser) + piece(u"SRK="_s, profile.ServerKey) +
+                   piece(u"STY="_s, QString::number(profile.JppBase)) +
+                   piece(u"MNA="_s, QString::number(profile.JppChunks)) +
+                   piece(u"ZPN="_s, QString::number(profile.ProfileNumber));
     for (std::size_t i = 0; i < 11; ++i) {
         if (const QString code = SizeCode(profile.SizeList[i]); !code.isEmpty())
-            text += piece(QStringLiteral("D1="), code);
+            text += piece(u"D1="_s, code);
     }
     for (const QString& size : profile.QuickSizes) {
         if (const QString code = SizeCode(size); !code.isEmpty())
-            text += piece(QStringLiteral("D2="), code);
+            text += piece(u"D2="_s, code);
     }
     return text;
 }
