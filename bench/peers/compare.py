@@ -10,7 +10,7 @@ elapsed time. --install fetches the peers from Debian first (root or sudo).
 import argparse, os, shutil, subprocess, sys, tempfile
 
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), ".."))
-from pairs import HEADING, compare
+from pairs import HEADING, compare, run
 
 PACKAGES = ["libvips-tools", "imagemagick", "libopencv-imgproc-dev", "libopencv-imgcodecs-dev", "libzimg-dev"]
 

@@ -40,6 +40,11 @@ Turn turnOf(int rotationCode) {
     }
 }
 
+// In whole pixels, rounded down, as the edit record counts.
+int middleOf(int side) {
+    return side / 2;
+}
+
 // The picture's own position of a point of the paper: u to the right and v down in zoomed pixels, (0, 0) the picture's
 // corner.
 struct Inverse {
@@ -49,8 +54,8 @@ struct Inverse {
 
     Inverse(const Placement& placement, PictureSize zoomed)
         : turn(turnOf(placement.rotationCode))
-        , originX(zoomed.width / 2 - (turn.cosine * placement.panX + turn.sine * placement.panY))
-        , originY(zoomed.height / 2 - (-turn.sine * placement.panX + turn.cosine * placement.panY)) {}
+        , originX(middleOf(zoomed.width) - (turn.cosine * placement.panX + turn.sine * placement.panY))
+        , originY(middleOf(zoomed.height) - (-turn.sine * placement.panX + turn.cosine * placement.panY)) {}
 
     double u(double x, double y) const { return turn.cosine * x + turn.sine * y + originX; }
     double v(double x, double y) const { return -turn.sine * x + turn.cosine * y + originY; }
@@ -174,7 +179,9 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
             auto range = narrowed({0, size.width}, startU, stepU, -edge, zoomed.width + edge);
             return narrowed(range, startV, stepV, -edge, zoomed.height + edge);
         };
-        const auto [from, to] = inside(outer);
+        const std::pair<int, int> shown = inside(outer);
+        const int from = shown.first;
+        const int to = shown.second;
         if (from >= to)
             continue;
         auto [solidFrom, solidTo] = inside(-outer);
@@ -255,8 +262,8 @@ PictureSize Placement::zoomed() const {
 Placement::Point Placement::onPaper(double x, double y) const {
     const Turn turn = turnOf(rotationCode);
     const PictureSize size = zoomed();
-    const double across = x - size.width / 2;
-    const double down = y - size.height / 2;
+    const double across = x - middleOf(size.width);
+    const double down = y - middleOf(size.height);
     return {panX + turn.cosine * across - turn.sine * down, panY + turn.sine * across + turn.cosine * down};
 }
 
