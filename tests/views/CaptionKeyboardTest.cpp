@@ -100,6 +100,6 @@ TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     EXPECT_EQ(chain.front()->id(), PageId::tFrmNew);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, CaptionKeyboard, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

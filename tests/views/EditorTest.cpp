@@ -170,6 +170,6 @@ TEST(EditorByKeyboard, ReachesEachToolAndLeavesByEsc) {
     walk.waitFor(u"kyoskNew"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, EditorLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, EditorLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

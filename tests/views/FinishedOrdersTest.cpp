@@ -112,6 +112,6 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     look(walk, u"67-sending-pieces"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, FinishedOrdersLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, FinishedOrdersLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

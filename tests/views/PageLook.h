@@ -9,6 +9,7 @@
 #include <gtest/gtest.h>
 
 #include <ostream>
+#include <string>
 
 namespace lumora {
 
@@ -25,6 +26,11 @@ public:
     static auto screens() {
         return ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true}, Screen{{1920, 1080}, false},
                                  Screen{{1920, 1080}, true});
+    }
+    static std::string nameOf(const ::testing::TestParamInfo<Screen>& info) {
+        const QSize size = info.param.size;
+        return std::to_string(size.width()) + "x" + std::to_string(size.height()) +
+               (info.param.english ? "English" : "Hebrew");
     }
 
 protected:

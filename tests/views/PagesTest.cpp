@@ -242,6 +242,6 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     look(walk, u"49-album-closing"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

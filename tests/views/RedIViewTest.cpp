@@ -194,7 +194,7 @@ TEST_P(RedEyeHands, GivesTheLabsOperatorTheBarAndTheReadings) {
     look(u"redi-8-operator"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView, PageLook::screens(), PageLook::nameOf);
 
 INSTANTIATE_TEST_SUITE_P(Screens, RedEyeHands, ::testing::Values(Screen{{1024, 768}, false}));
 

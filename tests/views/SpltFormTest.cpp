@@ -83,6 +83,6 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     walk.waitFor(u"MoogMeret"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, PiecesLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, PiecesLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

@@ -101,7 +101,7 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
     look(walk, u"01-start"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, StartLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, StartLook, PageLook::screens(), PageLook::nameOf);
 
 TEST(StartPage, HelpsAMouseAFingerAndTheKeyboard) {
     Walk walk({1024, 768});

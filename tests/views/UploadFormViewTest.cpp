@@ -109,6 +109,6 @@ TEST_P(UploadFormLook, WithoutAServerAndWithoutAnOrder) {
     look(walk, u"69-http-no-order"_s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, UploadFormLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, UploadFormLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora
