@@ -27,7 +27,8 @@ FolderPager foundPictures() {
 }
 
 QString line(int copies, const QString& path, LineForm form) {
-    return BasketLine{{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}, EditRecord::newPicture(), path}
+    return BasketLine{PrintCode{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}.compose(),
+                      EditRecord::newPicture(), path}
         .compose(form);
 }
 
@@ -74,7 +75,7 @@ void PlusOnTheLastPicture(benchmark::State& state) {
     for (auto _ : state) {
         const int index = basket.FindByPath(path);
         copies = copies % PrintCode::mostCopies + 1;
-        basket.replaceAt(index, PrintCode::copiesField(copies) + basket.item(index).mid(2));
+        basket.replaceAt(index, BasketLine::withCopies(basket.item(index), copies));
         benchmark::DoNotOptimize(basket.SumCopies());
     }
 }

@@ -31,7 +31,7 @@ int main(int argc, char** argv) {
     const QGuiApplication application(argc, argv);
     const std::filesystem::path file = argv[2];
     const double scale = argc > 3 ? std::atof(argv[3]) : 1;
-    constexpr PaperDigits paper{10, 15};
+    constexpr PaperSize paper{10, 15};
 
     EditFields edit;
     UnpackEditState(EditRecord::newPicture(), edit);

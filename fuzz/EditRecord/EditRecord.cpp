@@ -65,7 +65,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     if (packed[1] != packed[2])
         std::abort();
 
-    constexpr PaperDigits paper{1, 2};
+    constexpr PaperSize paper{1, 2};
     auto preview = EditedPreview::open(pictures.file, paper, edit.ZoomPercent,
                                        edit.ToneFlag == 1 ? EditedPreview::Tone::Grey : EditedPreview::Tone::Colour);
     if (!preview)

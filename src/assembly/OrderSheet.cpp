@@ -2,6 +2,7 @@
 
 #include "assembly/WorkAhead.h"
 #include "common/FixedText.h"
+#include "common/PaperSize.h"
 #include "session/SessionState.h"
 
 #include <QFont>
@@ -29,8 +30,6 @@ constexpr std::array<SizeStep, 5> sizeSteps = {{
     {200, {900, 1000}, {900, 1000}},
 }};
 constexpr PictureSize largestSheet = {1100, 1300};
-
-const QString mixedSizes = QStringLiteral("zz/zz");
 
 // Pixels of a 96 dpi screen: 12 and 8 points.
 constexpr int lineFontPixels = 16;

@@ -7,7 +7,7 @@
 
 namespace lumora {
 
-PictureSize paperPictureSize(PictureSize source, PaperDigits paper) {
+PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
     const double ratio = static_cast<double>(source.height) / std::max(source.width, 1);
     const int width = (ratio >= 1 ? paper.shortSide : paper.longSide) * pixelsPerCentimetre;
     // The product first: it is exact, so that a height of one half is seen as one.
@@ -18,7 +18,7 @@ PictureSize paperPictureSize(PictureSize source, PaperDigits paper) {
     return {width, static_cast<int>(rounded)};
 }
 
-Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperDigits paper) {
+Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper) {
     const Result<PictureSize> size = readPictureSize(source);
     if (!size)
         return size.failure();

@@ -1,6 +1,6 @@
 #include "assembly/PreparationPage.h"
 
-#include "order/OrderItem.h"
+#include "order/BasketLine.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -36,7 +36,7 @@ bool PreparationPage::takeLines() {
 }
 
 void PreparationPage::CountTotalPics() {
-    m_state.shemot.TotalPics = OrderItem::copiesOf(List1.items());
+    m_state.shemot.TotalPics = sumOfCopies(List1.items(), CopiesIn::BasketLines);
     Label5.text = QString::number(m_state.shemot.TotalPics);
 }
 
@@ -106,7 +106,7 @@ void PreparationPage::addFailed(const QString& path) {
 
 bool PreparationPage::openFolder(const OrderFolder& folder) {
     m_state.transfer.OrderFolder = folder.path();
-    const Result<void> made = makeOrderFolder(m_state, m_platform.files, folder);
+    const Result<void> made = makeOrderFolder(m_platform.files, folder);
     if (!made)
         tell(QStringLiteral("לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."),
              QStringLiteral("The order's folder can't be made. Free some space or mend the rights, then try again."),
@@ -153,7 +153,9 @@ void PreparationPage::countOrder() {
              counted.failure().message);
 }
 
-bool PreparationPage::writeLog(const OrderFolder& folder, const QByteArray& log) {
+bool PreparationPage::writeLog(const OrderFolder& folder, OrderLog::Layout layout) {
+    const QByteArray log =
+        OrderLog::of(m_state, layout, List1.items(), List4fail.items(), m_platform.clock.now()).write();
     if (const Result<void> logged = m_platform.files.writeWhole(folder.logPath(), log); !logged) {
         tell(QStringLiteral("לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."),
              QStringLiteral(

@@ -4,6 +4,7 @@
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "order/OrderFolder.h"
+#include "order/OrderLog.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"
@@ -69,7 +70,7 @@ protected:
     void tellWriteFailure(const Failure& failure);
     void countOrder();
     // False, with words: without its log an order does not leave.
-    bool writeLog(const OrderFolder& folder, const QByteArray& log);
+    bool writeLog(const OrderFolder& folder, OrderLog::Layout layout);
 
     // The order is whole: shows the page that goes on with it, or none at a local station, and leaves.
     void handOver(Outcome prepared);

@@ -19,7 +19,7 @@ PrintPacker::PrintPacker(const SessionState& state, const Files& files, OrderFol
     , m_tailForm(tailForm) {}
 
 void PrintPacker::beginStep() {
-    m_folderThere = makeOrderFolder(m_state, m_files, m_folder);
+    m_folderThere = makeOrderFolder(m_files, m_folder);
 }
 
 PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Result<QByteArray>()>& picture) {
@@ -42,7 +42,7 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
     const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));
     const QString name = PrintFileName{line.code, line.index, static_cast<int>(m_state.Optint), base}.text();
     const Result<void> written =
-        packed ? m_files.writeWhole(m_folder.printFilePath(name), *packed) : Result<void>(packed.failure());
+        packed ? m_files.writeWhole(m_folder.filePath(name), *packed) : Result<void>(packed.failure());
     return written ? Outcome{true, {}} : Outcome{false, written.failure()};
 }
 

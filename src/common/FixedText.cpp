@@ -84,10 +84,6 @@ QString PlainNumber(float number) {
     return text;
 }
 
-QString SizeCode(const QString& paper) {
-    return paper.left(2) + paper.right(2);
-}
-
 bool HasQuestionMark(const QString& text) {
     return text.contains(u'?');
 }

@@ -31,10 +31,6 @@ QString ZeroPadded(long long number, int width);
 // A number as plain decimal text with at most seven significant digits, never with an exponent, no trailing zeros.
 QString PlainNumber(float number);
 
-// The size code of a paper text: its first two characters and its last two. "10/15" gives "1015", an empty text an
-// empty code.
-QString SizeCode(const QString& paper);
-
 // True if the text holds a "?": what a character outside the code page has become.
 bool HasQuestionMark(const QString& text);
 

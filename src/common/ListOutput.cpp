@@ -6,6 +6,13 @@
 #include <utility>
 
 namespace lumora {
+namespace {
+
+const QDate zeroDay(1899, 12, 30);
+const QString dayAndTime = QStringLiteral("yyyy-MM-dd hh:mm:ss");
+const QString dayAlone = QStringLiteral("yyyy-MM-dd");
+
+} // namespace
 
 void ListOutput::separate() {
     if (!m_atLineStart)
@@ -27,12 +34,12 @@ ListOutput& ListOutput::number(long long value) {
 
 ListOutput& ListOutput::date(const std::optional<QDateTime>& value) {
     separate();
-    const QDateTime when = value.value_or(QDateTime(QDate(1899, 12, 30), QTime(0, 0)));
+    const QDateTime when = value.value_or(QDateTime(zeroDay, QTime(0, 0)));
     const bool midnight = when.time().msecsSinceStartOfDay() < 1000;
-    const bool zeroDate = when.date() == QDate(1899, 12, 30);
-    QString form = QStringLiteral("yyyy-MM-dd hh:mm:ss");
+    const bool zeroDate = when.date() == zeroDay;
+    QString form = dayAndTime;
     if (midnight)
-        form = QStringLiteral("yyyy-MM-dd");
+        form = dayAlone;
     else if (zeroDate)
         form = QStringLiteral("hh:mm:ss");
     m_bytes.append('#').append(when.toString(form).toLatin1()).append('#');
@@ -124,6 +131,15 @@ QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes) {
         entries += {line.mid(1, keyEnd - 1), quoted ? value.sliced(1, value.size() - 2) : value};
     }
     return entries;
+}
+
+std::optional<QDateTime> ListOutputDate(const QString& value) {
+    for (const QString& form : {dayAndTime, dayAlone}) {
+        const QDateTime date = QDateTime::fromString(WithoutEnds(value), form);
+        if (date.isValid() && date.date() != zeroDay)
+            return date;
+    }
+    return std::nullopt;
 }
 
 QString WithoutEnds(const QString& line) {

@@ -49,6 +49,9 @@ QStringList ListOutputLines(const QByteArray& bytes);
 // in a value, which the format leaves bare, do no harm. Lines without a key are passed over.
 QList<ListOutputEntry> ReadListOutput(const QByteArray& bytes);
 
+// A date as ListOutput writes it. No value for the zero date and for what is no date.
+std::optional<QDateTime> ListOutputDate(const QString& value);
+
 // A line without its first and its last character: how the detail stores take a quoted text back.
 QString WithoutEnds(const QString& line);
 

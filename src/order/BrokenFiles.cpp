@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "platform/files/Files.h"
 #include "session/TextList.h"
 
@@ -9,19 +10,15 @@
 
 namespace lumora {
 
-QString BrokenFilesPath(const QString& orderFolder) {
-    return JoinDrivePath(orderFolder, QStringLiteral("kashloo.txt"));
-}
-
-Result<void> WriteBrokenFiles(const Files& files, const QString& orderFolder, const TextList& broken) {
+Result<void> WriteBrokenFiles(const Files& files, const OrderFolder& folder, const TextList& broken) {
     QByteArray bytes;
     for (const QString& path : broken.items())
         bytes += AnsiCodePage::encode(path) + "\r\n";
-    return files.writeWhole(BrokenFilesPath(orderFolder), bytes);
+    return files.writeWhole(folder.brokenFilesPath(), bytes);
 }
 
-QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder) {
-    const QString path = BrokenFilesPath(orderFolder);
+QStringList ReadBrokenFiles(const Files& files, const OrderFolder& folder) {
+    const QString path = folder.brokenFilesPath();
     if (!files.fileExists(path))
         return {};
     const auto bytes = files.read(path);

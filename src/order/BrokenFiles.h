@@ -8,16 +8,14 @@
 namespace lumora {
 
 class Files;
+class OrderFolder;
 class TextList;
 
 // kashloo.txt in the local order folder: the files whose put failed, one full local path a line. It outlives the
-// program, so that what a broken put left on the server is not taken for a sent file when the order is sent again. A
-// write that fails is for the caller to
-// tell.
-QString BrokenFilesPath(const QString& orderFolder);
-Result<void> WriteBrokenFiles(const Files& files, const QString& orderFolder, const TextList& broken);
+// program, so that what a broken put left on the server is not taken for a sent file when the order is sent again.
+Result<void> WriteBrokenFiles(const Files& files, const OrderFolder& folder, const TextList& broken);
 // Empty when there is no such file.
-QStringList ReadBrokenFiles(const Files& files, const QString& orderFolder);
+QStringList ReadBrokenFiles(const Files& files, const OrderFolder& folder);
 
 // True if one of the paths has this leaf name.
 bool IsBroken(const TextList& broken, const QString& leafName);

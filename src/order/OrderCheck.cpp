@@ -1,9 +1,8 @@
 #include "order/OrderCheck.h"
 
 #include "common/FixedText.h"
-#include "common/ListOutput.h"
 #include "imaging/files/PictureFile.h"
-#include "order/OrderItem.h"
+#include "order/OrderLog.h"
 #include "order/OrderNames.h"
 #include "order/OrderTail.h"
 #include "order/PrintFileName.h"
@@ -20,58 +19,14 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-// What the log of an order says, of either print form and of the album form.
-struct ReadLog {
-    QString order;
-    QString timeOfJob;
-    int optint = 0;
-    OrderTail tail; // as the print files should carry it
-    int total = 0;
-    std::optional<int> failedCount; // the edited form does not count
-    QStringList failed;
-    QStringList items;
-    bool edited = false;
-
-    OrderItem split(const QString& item) const {
-        return OrderItem::split(item, edited ? OrderItem::Form::Edited : OrderItem::Form::Plain);
-    }
-};
-
-ReadLog readLog(const QByteArray& bytes) {
-    ReadLog log;
-    bool first = true;
-    for (const ListOutputEntry& entry : ReadListOutput(bytes)) {
-        if (first)
-            log.edited = entry.key == QLatin1String("KeSherLaSharat = ");
-        first = false;
-        const QString key = entry.key.startsWith(QLatin1String("Shemot.")) ? entry.key.mid(7) : entry.key;
-        if (key == QLatin1String("Hazmana"))
-            log.order = entry.value;
-        else if (key == QLatin1String("TimeOfJob"))
-            log.timeOfJob = entry.value;
-        else if (key == QLatin1String("Optint"))
-            log.optint = Val16(entry.value);
-        else if (key == QLatin1String("Option"))
-            log.optint = 2; // the edited form always says 5
-        else if (key == QLatin1String("n1"))
-            log.tail.name = entry.value;
-        else if (key == QLatin1String("n2"))
-            log.tail.telephone = entry.value;
-        else if (key == QLatin1String("ser"))
-            log.tail.serial = entry.value;
-        else if (key == QLatin1String("TotalPics"))
-            log.total = Val16(entry.value);
-        else if (key == QLatin1String("-----------Total Failed"))
-            log.failedCount = Val16(entry.value);
-        else if (key == QLatin1String("fail_") || key == QLatin1String("Failed  "))
-            log.failed += entry.value;
-        else if (key == QLatin1String("Shoora"))
-            log.items += entry.value;
-    }
-    // The album form carries no time of its own: the order's name is that and the number behind a "^".
-    log.tail.orderNumber = log.order.mid(log.order.lastIndexOf(u'^') + 1);
-    log.tail.totalPics = QString::number(log.total);
-    return log;
+// The tail that the print files of an order should carry.
+OrderTail tailOf(const OrderLog& log) {
+    return {log.shemot.n2,
+            log.shemot.n1,
+            QString::number(log.shemot.TotalPics),
+            OrderNumberOf(log.Hazmana),
+            log.shemot.ser,
+            {}};
 }
 
 QStringList namesWith(const fs::path& folder, const char* ending) {
@@ -88,17 +43,18 @@ QStringList namesWith(const fs::path& folder, const char* ending) {
 
 class Check {
 public:
-    Check(const fs::path& folder, PrintFileShape shape, ReadLog log)
+    Check(const fs::path& folder, PrintFileShape shape, OrderLog log)
         : m_folder(folder)
         , m_shape(shape)
-        , m_log(std::move(log)) {}
+        , m_log(std::move(log))
+        , m_tail(tailOf(m_log)) {}
 
     OrderFindings run(const QString& folderName) {
-        m_report.order = m_log.order;
+        m_report.order = m_log.Hazmana;
         m_report.items = static_cast<int>(m_log.items.size());
         m_report.failed = static_cast<int>(m_log.failed.size());
-        if (folderName != m_log.order && folderName != m_log.order + u'P')
-            fault(QStringLiteral("the log is that of order \"%1\"").arg(m_log.order));
+        if (folderName != m_log.Hazmana && folderName != m_log.Hazmana + u'P')
+            fault(QStringLiteral("the log is that of order \"%1\"").arg(m_log.Hazmana));
         checkTotals();
         checkSheet();
         for (const QString& name : namesWith(m_folder, ".jpp")) {
@@ -113,25 +69,29 @@ private:
     void fault(const QString& text) { m_report.faults += text; }
 
     void checkTotals() {
-        m_report.copies = OrderItem::copiesOf(m_log.items);
-        if (m_report.copies != m_log.total)
-            fault(
-                QStringLiteral("the log's total is %1, its lines add up to %2").arg(m_log.total).arg(m_report.copies));
-        if (m_log.failedCount && *m_log.failedCount != m_log.failed.size())
+        m_report.copies = sumOfCopies(m_log.items, CopiesIn::BasketLines);
+        if (m_report.copies != m_log.shemot.TotalPics)
+            fault(QStringLiteral("the log's total is %1, its lines add up to %2")
+                      .arg(m_log.shemot.TotalPics)
+                      .arg(m_report.copies));
+        if (m_log.countOfFailed && *m_log.countOfFailed != m_log.failed.size())
             fault(QStringLiteral("the log counts %1 failed pictures and names %2")
-                      .arg(*m_log.failedCount)
+                      .arg(*m_log.countOfFailed)
                       .arg(m_log.failed.size()));
     }
 
     // An edited order may have its sheet under a plain ending, instead or beside.
     void checkSheet() {
-        const QString stem = u'!' + m_log.tail.orderNumber + u'_' + m_log.tail.serial;
-        const QString plain = stem + QStringLiteral(".jpg");
-        const bool hasPlain = m_log.edited && has(plain);
+        const auto named = [this](const QString& ending) {
+            return SheetName(m_tail.orderNumber, m_tail.serial, ending);
+        };
+        const QString plain = named(QStringLiteral(".jpg"));
+        const QString sheet = named(QStringLiteral(".jpp"));
+        const bool hasPlain = m_log.layout == OrderLog::Layout::Edited && has(plain);
         if (hasPlain)
             checkSheet(plain);
-        if (!hasPlain || has(stem + QStringLiteral(".jpp")))
-            checkSheet(stem + QStringLiteral(".jpp"));
+        if (!hasPlain || has(sheet))
+            checkSheet(sheet);
     }
 
     bool has(const QString& name) const {
@@ -165,7 +125,7 @@ private:
         if (!tail)
             return; // a print file may go without
         // An album's log holds no customer.
-        const bool customerKnown = m_log.optint != 10;
+        const bool customerKnown = m_log.Optint != OrderKind::Album;
         const auto compare = [&](const char* what, const QString& found, const QString& logged, int width) {
             QString wanted = LeftField(logged, width);
             while (wanted.endsWith(u' '))
@@ -175,12 +135,12 @@ private:
                           .arg(name, QLatin1String(what), found, wanted));
         };
         if (customerKnown) {
-            compare("telephone", tail->telephone, m_log.tail.telephone, 10);
-            compare("name", tail->name, m_log.tail.name, 10);
+            compare("telephone", tail->telephone, m_tail.telephone, 10);
+            compare("name", tail->name, m_tail.name, 10);
         }
-        compare("total", tail->totalPics, m_log.tail.totalPics, 3);
-        compare("order number", tail->orderNumber, m_log.tail.orderNumber, 3);
-        compare("serial", tail->serial, m_log.tail.serial, 4);
+        compare("total", tail->totalPics, m_tail.totalPics, 3);
+        compare("order number", tail->orderNumber, m_tail.orderNumber, 3);
+        compare("serial", tail->serial, m_tail.serial, 4);
     }
 
     void checkName(const QString& name) {
@@ -192,23 +152,23 @@ private:
         // The place in the order has four digits only, so that several lines may be meant.
         bool found = false;
         for (qsizetype i = parts->index; i < m_log.items.size() && !found; i += 10000) {
-            const OrderItem item = m_log.split(m_log.items[i]);
+            const BasketLine item = m_log.line(i);
             found = item.code == parts->code && PrintBaseName(item.path) == parts->baseName;
             if (found)
                 m_made.insert(static_cast<int>(i), name);
         }
         if (!found)
             fault(QStringLiteral("%1: no line of the log has this place, code and picture").arg(name));
-        if (parts->optint != m_log.optint)
+        if (parts->optint != static_cast<int>(m_log.Optint))
             fault(QStringLiteral("%1: the kind of order is %2, the log has %3")
                       .arg(name)
                       .arg(parts->optint)
-                      .arg(m_log.optint));
+                      .arg(static_cast<int>(m_log.Optint)));
     }
 
     void checkEveryItemIsThere() {
         for (qsizetype i = 0; i < m_log.items.size(); ++i) {
-            const OrderItem item = m_log.split(m_log.items[i]);
+            const BasketLine item = m_log.line(i);
             const bool excused = !item.hasUsableName() || m_log.failed.contains(item.path);
             if (!m_made.contains(static_cast<int>(i)) && !excused)
                 fault(QStringLiteral("line %1 of the basket (%2) has no print file and is not named as failed")
@@ -219,7 +179,8 @@ private:
 
     const fs::path m_folder;
     const PrintFileShape m_shape;
-    const ReadLog m_log;
+    const OrderLog m_log;
+    const OrderTail m_tail;
     QMultiMap<int, QString> m_made;
     OrderFindings m_report;
 };
@@ -266,8 +227,9 @@ Result<OrderFindings> checkOrderFolder(const fs::path& folder, PrintFileShape sh
     const Result<QByteArray> bytes = readHostFile(folder / toHostPath(logs[0]));
     if (!bytes)
         return bytes.failure();
-    ReadLog log = readLog(*bytes);
-    if (log.order.isEmpty())
+    OrderLog log;
+    log.read(*bytes);
+    if (log.Hazmana.isEmpty())
         return Failure{Failure::Kind::Damaged, QStringLiteral("%1: no order log").arg(logs[0])};
     return Check(folder, shape, std::move(log)).run(name);
 }

@@ -1,9 +1,6 @@
 #pragma once
 
 #include <QString>
-#include <QStringList>
-
-#include <cstdint>
 
 namespace lumora {
 
@@ -17,9 +14,5 @@ void ReadOrderDetails(const Files& files, const QString& path, OrderDetails& det
 // The same for an order of an earlier day: the nine fields are cleared first, so that nothing of another customer is
 // told. The log of an album has none of the nine keys; its photographer, size, address and total take their places.
 void ReadResentDetails(const Files& files, const QString& path, OrderDetails& details);
-
-// The copies of all files of an order: the first two characters of each leaf name, but for texts. The sheet and names
-// that begin with letters add 0. Held at 32767.
-std::int16_t CopiesCount(const QStringList& leafNames);
 
 } // namespace lumora

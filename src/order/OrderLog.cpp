@@ -1,137 +1,199 @@
 #include "order/OrderLog.h"
 
+#include "common/FixedText.h"
 #include "common/ListOutput.h"
-#include "session/SessionState.h"
+#include "order/OrderNames.h"
+
+#include <QList>
+
+#include <algorithm>
+#include <variant>
 
 namespace lumora {
 namespace {
 
-const QString stars = QString(45, u'*');
+using Layout = OrderLog::Layout;
 
-QString orderName(const SessionState& state) {
-    return state.shemot.TimeOfJob + state.MisparHazmana;
+// A line's key and where its value stands in the log: a text, an integer, an integer that is written as a text, a date,
+// or a text that is the same in every log.
+struct Quoted {
+    std::int16_t* number;
+};
+struct Fixed {
+    QString text;
+};
+struct Line {
+    QString key;
+    std::variant<QString*, std::int16_t*, Quoted, OrderKind*, std::optional<QDateTime>*, Fixed> value;
+};
+using Lines = QList<Line>;
+
+const QString totalFailed = QStringLiteral("-----------Total Failed");
+const QString failedPath = QStringLiteral("fail_");
+const QString editedFailedPath = QStringLiteral("Failed  ");
+const QString basketLine = QStringLiteral("Shoora");
+
+const Line zeros{QStringLiteral("00"), Fixed{QStringLiteral("00")}};
+const Line stars{QStringLiteral("***"), Fixed{QString(45, u'*')}};
+
+// Nothing sets these three; the lab's reader expects their lines.
+Lines serverLines(OrderLog& log, const QString& sign) {
+    return {{QStringLiteral("KeSherLaSharat") + sign, Quoted{&log.KeSherLaSharat}},
+            {QStringLiteral("HitKasherDerech") + sign, &log.HitKasherDerech},
+            {QStringLiteral("TaooyotBaHaShvaa") + sign, &log.TaooyotBaHaShvaa}};
 }
 
-// Three values that nothing sets; their places in the file are part of the format.
-void writeServerLines(ListOutput& log, const SessionState& state) {
-    log.pair(QStringLiteral("KeSherLaSharat"), QString::number(state.transfer.KeSherLaSharat));
-    log.pair(QStringLiteral("HitKasherDerech"), state.transfer.HitKasherDerech);
-    log.text(QStringLiteral("TaooyotBaHaShvaa")).number(state.transfer.TaooyotBaHaShvaa).endLine();
-    log.pair(QString(12, u'-'), QString(9, u'-'));
+Lines nameLines(OrderLog& log, const QString& prefix) {
+    return {{prefix + QStringLiteral("Girsa"), &log.shemot.Girsa},
+            {QStringLiteral("Time"), &log.Time},
+            {QStringLiteral("Hazmana"), &log.Hazmana}};
 }
 
-// From the serial to the fit: the same lines in a plain and in an edited order.
-void writeDetails(ListOutput& log, const OrderDetails& shemot) {
-    log.pair(QStringLiteral("Shemot.ser"), shemot.ser);
-    log.pair(QStringLiteral("Shemot.n1"), shemot.n1);
-    log.pair(QStringLiteral("Shemot.n2"), shemot.n2);
-    log.pair(QStringLiteral("Shemot.n3"), shemot.n3);
-    log.pair(QStringLiteral("Shemot.n4"), shemot.n4);
-    log.text(QStringLiteral("Shemot.TotalPics")).number(shemot.TotalPics).endLine();
-    log.pair(QStringLiteral("Shemot.Mail"), shemot.Mail);
-    log.pair(QStringLiteral("Shemot.TimeOfJob"), shemot.TimeOfJob);
-    log.pair(QStringLiteral("Shemot.Hearot"), shemot.Hearot);
-    log.pair(QStringLiteral("Shemot.ppr"), shemot.ppr);
-    log.text(QStringLiteral("Shemot.T1")).date(shemot.T1).endLine();
-    log.pair(QStringLiteral("Shemot.Bord"), shemot.Bord);
-    log.pair(QStringLiteral("Shemot.maat"), shemot.maat);
-    log.pair(QStringLiteral("Shemot.FillFit"), shemot.FillFit);
-}
-
-void writePrintHead(ListOutput& log, const SessionState& state, const QDateTime& now) {
-    log.pair(QStringLiteral("00"), QStringLiteral("00"));
-    writeServerLines(log, state);
-    log.pair(QStringLiteral("Shemot.Girsa"), state.shemot.Girsa);
-    log.text(QStringLiteral("Time")).date(now).endLine();
-    log.pair(QStringLiteral("Hazmana"), orderName(state));
-    log.text(QStringLiteral("Optint")).number(static_cast<std::int16_t>(state.Optint)).endLine();
-    writeDetails(log, state.shemot);
+Lines detailLines(OrderDetails& shemot) {
+    return {{QStringLiteral("Shemot.ser"), &shemot.ser},       {QStringLiteral("Shemot.n1"), &shemot.n1},
+            {QStringLiteral("Shemot.n2"), &shemot.n2},         {QStringLiteral("Shemot.n3"), &shemot.n3},
+            {QStringLiteral("Shemot.n4"), &shemot.n4},         {QStringLiteral("Shemot.TotalPics"), &shemot.TotalPics},
+            {QStringLiteral("Shemot.Mail"), &shemot.Mail},     {QStringLiteral("Shemot.TimeOfJob"), &shemot.TimeOfJob},
+            {QStringLiteral("Shemot.Hearot"), &shemot.Hearot}, {QStringLiteral("Shemot.ppr"), &shemot.ppr},
+            {QStringLiteral("Shemot.T1"), &shemot.T1},         {QStringLiteral("Shemot.Bord"), &shemot.Bord},
+            {QStringLiteral("Shemot.maat"), &shemot.maat},     {QStringLiteral("Shemot.FillFit"), &shemot.FillFit}};
 }
 
 // The extras are numbered from 1 here, from 0 in the session's lists: the last place of each list never travels.
-void writeAlbumHead(ListOutput& log, const SessionState& state, const QDateTime& now) {
-    const AlbumDetails& album = state.album;
-    log.pair(QStringLiteral("00"), QStringLiteral("00"));
-    log.pair(QStringLiteral("00"), QStringLiteral("00"));
-    writeServerLines(log, state);
-    log.pair(QStringLiteral("Girsa"), state.shemot.Girsa);
-    log.text(QStringLiteral("Time")).date(now).endLine();
-    log.pair(QStringLiteral("Hazmana"), orderName(state));
-    log.text(QStringLiteral("Optint")).number(static_cast<std::int16_t>(state.Optint)).endLine();
-    log.pair(QStringLiteral("ser"), state.shemot.ser);
-    log.text(QStringLiteral("TotalPics")).number(state.shemot.TotalPics).endLine();
-    log.pair(QStringLiteral("GodelLBM"), album.GodelLBM);
-    log.pair(QStringLiteral("Hearot"), album.HearotLBM);
-    log.pair(QStringLiteral("MailZalam"), album.MailZalam);
-    log.pair(QStringLiteral("ShemErooa"), album.ShemErooa);
-    log.pair(QStringLiteral("ShemZalam"), album.ShemZalam);
-    log.pair(QStringLiteral("SoogKricha"), album.SoogKricha);
-    log.pair(QStringLiteral("SoogLBM"), album.SoogLBM);
-    log.pair(QStringLiteral("SoogNiar"), album.SoogNiar);
+Lines albumLines(OrderLog& log) {
+    AlbumDetails& album = log.album;
+    Lines lines = {
+        {QStringLiteral("ser"), &log.shemot.ser},        {QStringLiteral("TotalPics"), &log.shemot.TotalPics},
+        {QStringLiteral("GodelLBM"), &album.GodelLBM},   {QStringLiteral("Hearot"), &album.HearotLBM},
+        {QStringLiteral("MailZalam"), &album.MailZalam}, {QStringLiteral("ShemErooa"), &album.ShemErooa},
+        {QStringLiteral("ShemZalam"), &album.ShemZalam}, {QStringLiteral("SoogKricha"), &album.SoogKricha},
+        {QStringLiteral("SoogLBM"), &album.SoogLBM},     {QStringLiteral("SoogNiar"), &album.SoogNiar}};
     for (std::size_t i = 1; i < album.Tosafot1.size(); ++i)
-        log.pair(QStringLiteral("Tosafot1_%1").arg(i), album.Tosafot1[i - 1]);
+        lines += {QStringLiteral("Tosafot1_%1").arg(i), &album.Tosafot1[i - 1]};
     for (std::size_t i = 1; i < album.Tosafot2.size(); ++i)
-        log.pair(QStringLiteral("Tosafot2_%1").arg(i), album.Tosafot2[i - 1]);
+        lines += {QStringLiteral("Tosafot2_%1").arg(i), &album.Tosafot2[i - 1]};
+    return lines;
 }
 
-void writeStars(ListOutput& log) {
-    log.pair(QStringLiteral("***"), stars);
+// All lines above the failed pictures, in the order in which a log has them.
+Lines headLines(OrderLog& log, Layout layout) {
+    // The lab's reader of an edited order knows no other kind than 5.
+    if (layout == Layout::Edited)
+        return serverLines(log, QStringLiteral(" = ")) + Lines{zeros} + nameLines(log, QStringLiteral("Shemot.")) +
+               Lines{{QStringLiteral("Option"), Fixed{QStringLiteral("5")}}} + detailLines(log.shemot) + Lines{stars};
+    const bool album = layout == Layout::Album;
+    return (album ? Lines{zeros, zeros} : Lines{zeros}) + serverLines(log, {}) +
+           Lines{{QString(12, u'-'), Fixed{QString(9, u'-')}}} +
+           nameLines(log, album ? QString() : QStringLiteral("Shemot.")) +
+           Lines{{QStringLiteral("Optint"), &log.Optint}} + (album ? albumLines(log) : detailLines(log.shemot)) +
+           Lines{{QStringLiteral("More Comp = "), &log.DchisaAmoka}, stars};
 }
 
-void writeItems(ListOutput& log, const QStringList& items) {
-    for (const QString& item : items)
-        log.pair(QStringLiteral("Shoora"), item);
-}
+struct Writer {
+    ListOutput& output;
 
-void writeTail(ListOutput& log, const QStringList& items, const QStringList& failed) {
-    const auto blank = [&log] { log.text(QStringLiteral(" ")).endLine(); };
-    log.pair(QStringLiteral("-----------Total Failed"), QString::number(failed.size()) + QString(11, u'-'));
+    void operator()(const QString* text) const { output.text(*text); }
+    void operator()(const std::int16_t* number) const { output.number(*number); }
+    void operator()(Quoted quoted) const { output.text(QString::number(*quoted.number)); }
+    void operator()(const OrderKind* kind) const { output.number(static_cast<std::int16_t>(*kind)); }
+    void operator()(const std::optional<QDateTime>* date) const { output.date(*date); }
+    void operator()(const Fixed& fixed) const { output.text(fixed.text); }
+};
+
+struct Reader {
+    const QString& value;
+
+    void operator()(QString* text) const { *text = value; }
+    void operator()(std::int16_t* number) const { *number = Val16(value); }
+    void operator()(Quoted quoted) const { *quoted.number = Val16(value); }
+    void operator()(OrderKind* kind) const { *kind = static_cast<OrderKind>(Val16(value)); }
+    void operator()(std::optional<QDateTime>* date) const { *date = ListOutputDate(value); }
+    void operator()(const Fixed&) const {}
+};
+
+void writeFailed(ListOutput& output, const QStringList& failed) {
+    const auto blank = [&output] { output.text(QStringLiteral(" ")).endLine(); };
+    output.pair(totalFailed, QString::number(failed.size()) + QString(11, u'-'));
     blank();
     for (const QString& path : failed)
-        log.pair(QStringLiteral("fail_"), path);
+        output.pair(failedPath, path);
     blank();
-    log.pair(QStringLiteral("-----------End"), QStringLiteral("Of Failed List-------------"));
+    output.pair(QStringLiteral("-----------End"), QStringLiteral("Of Failed List-------------"));
     blank();
-    log.pair(QString(11, u'-'), QString(30, u'-'));
+    output.pair(QString(11, u'-'), QString(30, u'-'));
     blank();
-    writeItems(log, items);
+}
+
+void writeEditedFailed(ListOutput& output, const QStringList& failed) {
+    output.pair(stars.key, QStringLiteral("****    Failed    ***************************"));
+    for (const QString& path : failed)
+        output.pair(editedFailedPath, path);
+    output.pair(stars.key, std::get<Fixed>(stars.value).text);
+}
+
+Layout layoutOf(const QList<ListOutputEntry>& entries) {
+    const auto opens = [&](qsizetype at, const QString& key) { return at < entries.size() && entries[at].key == key; };
+    if (opens(0, QStringLiteral("KeSherLaSharat = ")))
+        return Layout::Edited;
+    return opens(0, zeros.key) && opens(1, zeros.key) ? Layout::Album : Layout::Plain;
 }
 
 } // namespace
 
-QByteArray plainOrderLog(const SessionState& state, const QStringList& items, const QStringList& failed,
-                         const QDateTime& now) {
-    ListOutput log;
-    if (state.Optint == OrderKind::Album)
-        writeAlbumHead(log, state, now);
-    else
-        writePrintHead(log, state, now);
-    log.text(QStringLiteral("More Comp = ")).number(state.DchisaAmoka).endLine();
-    writeStars(log);
-    writeTail(log, items, failed);
-    return log.bytes();
+OrderLog OrderLog::of(const SessionState& state, Layout layout, const QStringList& items, const QStringList& failed,
+                      const QDateTime& now) {
+    OrderLog log;
+    log.layout = layout;
+    log.Time = now;
+    log.Hazmana = OrderName(state.shemot.TimeOfJob, state.MisparHazmana);
+    log.Optint = state.Optint;
+    log.DchisaAmoka = state.DchisaAmoka;
+    log.KeSherLaSharat = state.transfer.KeSherLaSharat;
+    log.HitKasherDerech = state.transfer.HitKasherDerech;
+    log.TaooyotBaHaShvaa = state.transfer.TaooyotBaHaShvaa;
+    log.shemot = state.shemot;
+    log.album = state.album;
+    log.failed = failed;
+    log.items = items;
+    return log;
 }
 
-// The kind of order is always told as 5, whatever the session holds: the lab's reader of this form knows no other.
-QByteArray editedOrderLog(const SessionState& state, const QStringList& items, const QStringList& failed,
-                          const QDateTime& now) {
-    ListOutput log;
-    log.pair(QStringLiteral("KeSherLaSharat = "), QString::number(state.transfer.KeSherLaSharat));
-    log.pair(QStringLiteral("HitKasherDerech = "), state.transfer.HitKasherDerech);
-    log.text(QStringLiteral("TaooyotBaHaShvaa = ")).number(state.transfer.TaooyotBaHaShvaa).endLine();
-    log.pair(QStringLiteral("00"), QStringLiteral("00"));
-    log.pair(QStringLiteral("Shemot.Girsa"), state.shemot.Girsa);
-    log.text(QStringLiteral("Time")).date(now).endLine();
-    log.pair(QStringLiteral("Hazmana"), orderName(state));
-    log.pair(QStringLiteral("Option"), QStringLiteral("5"));
-    writeDetails(log, state.shemot);
-    writeStars(log);
-    log.pair(QStringLiteral("***"), QStringLiteral("****    Failed    ***************************"));
-    for (const QString& path : failed)
-        log.pair(QStringLiteral("Failed  "), path);
-    writeStars(log);
-    writeItems(log, items);
-    return log.bytes();
+QByteArray OrderLog::write() const {
+    ListOutput output;
+    OrderLog log = *this; // the lines lead to fields that may be changed
+    for (const Line& line : headLines(log, layout)) {
+        output.text(line.key);
+        std::visit(Writer{output}, line.value);
+        output.endLine();
+    }
+    if (layout == Layout::Edited)
+        writeEditedFailed(output, failed);
+    else
+        writeFailed(output, failed);
+    for (const QString& item : items)
+        output.pair(basketLine, item);
+    return output.bytes();
+}
+
+void OrderLog::read(const QByteArray& bytes) {
+    const QList<ListOutputEntry> entries = ReadListOutput(bytes);
+    layout = layoutOf(entries);
+    const Lines lines =
+        headLines(*this, Layout::Plain) + headLines(*this, Layout::Album) + headLines(*this, Layout::Edited);
+    for (const auto& [key, value] : entries) {
+        if (key == basketLine)
+            items += value;
+        else if (key == failedPath || key == editedFailedPath)
+            failed += value;
+        else if (key == totalFailed)
+            countOfFailed = Val16(value);
+        else if (const auto line = std::find_if(lines.begin(), lines.end(),
+                                                [&name = key](const Line& one) { return one.key == name; });
+                 line != lines.end())
+            std::visit(Reader{value}, line->value);
+    }
+    if (layout == Layout::Edited)
+        Optint = OrderKind::EditedPrint;
 }
 
 } // namespace lumora

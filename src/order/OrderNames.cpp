@@ -1,8 +1,18 @@
 #include "order/OrderNames.h"
 
-#include "common/DrivePathText.h"
-
 namespace lumora {
+
+QString OrderName(const QString& TimeOfJob, const QString& number) {
+    return TimeOfJob + number;
+}
+
+QString OrderNumberOf(const QString& name) {
+    return name.mid(name.lastIndexOf(u'^') + 1);
+}
+
+QString SheetName(const QString& number, const QString& serial, const QString& ending) {
+    return u'!' + number + u'_' + serial + ending;
+}
 
 bool IsSheet(const QString& leaf) {
     return leaf.startsWith(u'!');
@@ -10,10 +20,6 @@ bool IsSheet(const QString& leaf) {
 
 bool TravelsInPieces(const QString& folder) {
     return folder.endsWith(u'P');
-}
-
-QString OrderTextPath(const QString& folder) {
-    return JoinDrivePath(folder, LeafName(folder) + QStringLiteral(".txt"));
 }
 
 } // namespace lumora

@@ -1,13 +1,14 @@
 #include "order/OrderReport.h"
 
+#include "common/PaperSize.h"
 #include "session/SessionState.h"
 
 namespace lumora {
 
 namespace {
 
-bool isReported(const SessionState& state) {
-    return state.transfer.SugMishloah == Sending::NewOrder || state.transfer.SugMishloah == Sending::Resend;
+bool isReported(const TransferState& transfer) {
+    return transfer.SugMishloah == Sending::NewOrder || transfer.SugMishloah == Sending::Resend;
 }
 
 // A line break inside a value would end the request line.
@@ -30,25 +31,23 @@ QString PaperKindLetter(const QString& maat) {
     return {};
 }
 
-QString OrderReportQuery(const SessionState& state) {
-    if (!isReported(state))
+QString OrderReportQuery(const ClientProfile& profile, const TransferState& transfer, const OrderDetails& shemot) {
+    if (!isReported(transfer))
         return {};
-    const OrderDetails& shemot = state.shemot;
-    const QString paper = shemot.ppr.left(2) + u'_' + shemot.ppr.right(2);
-    return onOneLine(QStringLiteral("?k1=") + state.profile.ClientCode +                           //
-                     QStringLiteral("&t1=") + state.transfer.ShemTikiya + QStringLiteral("    ") + //
-                     paper + PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit + u'_' + shemot.Bord +
-                     QStringLiteral("&t2=Notes: ") + shemot.Hearot + //
+    return onOneLine(QStringLiteral("?k1=") + profile.ClientCode +                           //
+                     QStringLiteral("&t1=") + transfer.ShemTikiya + QStringLiteral("    ") + //
+                     SizeCode(shemot.ppr, QStringLiteral("_")) + PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit +
+                     u'_' + shemot.Bord + QStringLiteral("&t2=Notes: ") + shemot.Hearot + //
                      QStringLiteral("&t3=Pratim: ") + shemot.n2 + QStringLiteral("    ") + shemot.n1 +
                      QStringLiteral("&t4=Adress: ") + shemot.n3 + //
                      QStringLiteral("&t5=Mail: ") + shemot.Mail + //
                      QStringLiteral("&t8=Total_pics: ") + QString::number(shemot.TotalPics));
 }
 
-QString DoneQuery(const SessionState& state) {
-    if (!isReported(state))
+QString DoneQuery(const ClientProfile& profile, const TransferState& transfer) {
+    if (!isReported(transfer))
         return {};
-    return onOneLine(QStringLiteral("?t1=") + state.profile.ClientCode + QStringLiteral("&t2=true"));
+    return onOneLine(QStringLiteral("?t1=") + profile.ClientCode + QStringLiteral("&t2=true"));
 }
 
 } // namespace lumora

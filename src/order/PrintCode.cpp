@@ -1,9 +1,9 @@
 #include "order/PrintCode.h"
 
-#include "order/EditRecord.h"
+#include "common/PaperSize.h"
 #include "session/SessionState.h"
 
-#include <algorithm>
+#include <cmath>
 
 namespace lumora {
 
@@ -11,13 +11,19 @@ QString PrintCode::compose() const {
     return copiesField(copies) + LeftField(size, 4) + paper + LeftField(border, 2);
 }
 
-PrintCode PrintCode::split(const QString& line) {
-    const QString code = LeftField(line, width);
-    return {copiesOf(code), code.mid(2, 4), code.at(6), code.mid(7, 2)};
+int PrintCode::copiesOf(const QString& line) {
+    return Val16(line.left(copiesWidth));
 }
 
-int PrintCode::copiesOf(const QString& line) {
-    return Val16(line.left(2));
+std::int16_t sumOfCopies(const QStringList& texts, CopiesIn carriers) {
+    double total = 0;
+    for (const QString& text : texts) {
+        if (text.endsWith(QLatin1String("txt")))
+            continue;
+        const double copies = Val(text.left(PrintCode::copiesWidth));
+        total += carriers == CopiesIn::FileNames ? std::floor(copies) : copies;
+    }
+    return HoldIn16Bits(total);
 }
 
 QChar paperLetter(const QString& maat, PaperWords words, QChar previous) {
@@ -30,25 +36,7 @@ QChar paperLetter(const QString& maat, PaperWords words, QChar previous) {
 }
 
 QString sizeField(const OrderDetails& shemot) {
-    return LeftField(shemot.ppr == QStringLiteral("zz/zz") ? shemot.CustomCode : SizeCode(shemot.ppr), 4);
-}
-
-int BasketLine::pathColumn(LineForm form) {
-    return form == LineForm::Full ? PrintCode::width + EditRecord::width : PrintCode::width;
-}
-
-QString BasketLine::compose(LineForm form) const {
-    QString line = code.compose();
-    if (form == LineForm::Full)
-        line += LeftField(editState, EditRecord::width);
-    return line + path;
-}
-
-BasketLine BasketLine::split(const QString& line, LineForm form) {
-    BasketLine parts{PrintCode::split(line), {}, line.mid(pathColumn(form))};
-    if (form == LineForm::Full)
-        parts.editState = LeftField(line.mid(PrintCode::width, EditRecord::width), EditRecord::width);
-    return parts;
+    return LeftField(shemot.ppr == mixedSizes ? shemot.CustomCode : SizeCode(shemot.ppr), 4);
 }
 
 } // namespace lumora

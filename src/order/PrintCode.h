@@ -1,17 +1,22 @@
 #pragma once
 
 #include "common/FixedText.h"
-#include "session/SessionState.h"
 
 #include <QChar>
 #include <QString>
+#include <QStringList>
+
+#include <cstdint>
 
 namespace lumora {
 
-// The first nine characters of a basket line: copies (2), size code (4), paper letter (1), border code (2). All later
-// stages cut it by position.
+struct OrderDetails;
+
+// The print code, nine characters: copies (2), size code (4), paper letter (1), border code (2). A basket line and the
+// name of a print file begin with it, and all later stages cut it by position.
 struct PrintCode {
     static constexpr int width = 9;
+    static constexpr int copiesWidth = 2;
     static constexpr int mostCopies = 99;
 
     int copies = 0;
@@ -20,12 +25,19 @@ struct PrintCode {
     QString border;     // cut to two characters in the code: "WBX" becomes "WB"
 
     QString compose() const;
-    // From the first nine characters of a line; what is no number counts as no copies.
-    static PrintCode split(const QString& line);
+    // From the first two characters of a line; what is no number counts as no copies.
     static int copiesOf(const QString& line);
     // The two characters of the copies.
-    static QString copiesField(int copies) { return LeftField(QString::number(copies), 2); }
+    static QString copiesField(int copies) { return LeftField(QString::number(copies), copiesWidth); }
 };
+
+// What has the copies in its first two characters. A name that no order gave may hold a part of a copy, which does not
+// count.
+enum class CopiesIn { BasketLines, FileNames };
+
+// The copies of all texts but those that end in "txt", held at 32767. The order sheet, whose name begins with "!", and
+// names that begin with letters add 0.
+std::int16_t sumOfCopies(const QStringList& texts, CopiesIn carriers);
 
 // Which words for the paper a path of the program knows. The offer of a whole folder knows fewer of them than the click
 // of a picture, and labs have codes that rely on it.
@@ -36,25 +48,5 @@ QChar paperLetter(const QString& maat, PaperWords words, QChar previous);
 
 // Four characters: the size code of the paper; for a special size ("zz/zz") the customer's own code, blank by default.
 QString sizeField(const OrderDetails& shemot);
-
-// How the lines of a basket are built. An edited order carries the edit record between code and path.
-enum class LineForm { Short, Full };
-
-constexpr LineForm lineFormOf(OrderKind kind) {
-    return printsAsTheyAre(kind) ? LineForm::Short : LineForm::Full;
-}
-
-// One line of the basket: code (9), in the full form the edit record (200), then the full path in any length.
-struct BasketLine {
-    PrintCode code;
-    QString editState; // full form only
-    QString path;
-
-    // Characters before the path.
-    static int pathColumn(LineForm form);
-
-    QString compose(LineForm form) const;
-    static BasketLine split(const QString& line, LineForm form);
-};
 
 } // namespace lumora

@@ -3,13 +3,14 @@
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
+#include "order/PrintCode.h"
 
 #include <QRegularExpression>
 
 namespace lumora {
 
 QString PrintFileName::text() const {
-    return code.left(9) + ZeroPadded(index, 4) + u'_' + QString::number(optint).rightJustified(2, u'0') +
+    return code.left(PrintCode::width) + ZeroPadded(index, 4) + u'_' + QString::number(optint).rightJustified(2, u'0') +
            TextToHex(RightPart(AnsiCodePage::squeeze(baseName), 20)) + QStringLiteral(".jpp");
 }
 
@@ -24,7 +25,7 @@ std::optional<PrintFileName> PrintFileName::parse(const QString& name) {
 }
 
 int PrintFileName::copies() const {
-    return Val16(code.left(2));
+    return PrintCode::copiesOf(code);
 }
 
 QString PrintBaseName(const QString& path) {

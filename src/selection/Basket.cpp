@@ -3,7 +3,6 @@
 #include <QSet>
 
 #include <algorithm>
-#include <limits>
 
 namespace lumora {
 
@@ -76,13 +75,13 @@ void Basket::removeAt(int index) {
 }
 
 int Basket::SumCopies() const {
-    return static_cast<int>(std::min<long long>(m_copies, std::numeric_limits<std::int16_t>::max()));
+    return HoldIn16Bits(static_cast<double>(m_copies));
 }
 
 void Basket::removeDuplicates() {
     QSet<QString> seen;
     for (int i = 0; i < count();) {
-        const QString rest = item(i).mid(2);
+        const QString rest = BasketLine::withoutCopies(item(i));
         if (seen.contains(rest)) {
             removeAt(i);
         } else {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "order/PrintCode.h"
+#include "order/BasketLine.h"
 #include "session/TextList.h"
 
 #include <QHash>

@@ -5,27 +5,11 @@
 #include "support/SmallDisk.h"
 
 #include <QCoreApplication>
-#include <QCryptographicHash>
 #include <QDeadlineTimer>
 #include <QPainter>
 
 namespace lumora {
 namespace {
-
-TEST_F(PreparingAnEditedOrder, writesTheLogThatTheLabExpectsToTheByte) {
-    const QString newPicture = EditRecord::newPicture();
-    givePicture(u"IMG_0012.jpg"_s);
-    giveFile(u"IMG_0013.jpg"_s, "no picture");
-    prepare(
-        {edited(u"C:\\pics\\IMG_0012.jpg"_s, newPicture, u"12"_s), edited(u"C:\\pics\\IMG_0013.jpg"_s, newPicture)});
-
-    const Result<QByteArray> log = machine.files.read(logPath());
-    ASSERT_TRUE(log);
-    EXPECT_EQ(log->count('\n'), 28);
-    EXPECT_EQ(log->size(), 1220);
-    EXPECT_EQ(QCryptographicHash::hash(*log, QCryptographicHash::Sha256).toHex().left(16), "a9e4f5e707d207c7")
-        << log->constData();
-}
 
 TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     state.SugTzad = 60;

@@ -5,22 +5,13 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
-TEST(PaperResize, readsAPaperFromItsFirstAndLastTwoCharacters) {
-    EXPECT_EQ(PaperDigits::ofPaper(u"10/15"_s), (PaperDigits{10, 15}));
-    EXPECT_EQ(PaperDigits::ofPaper(u"09/13"_s), (PaperDigits{9, 13}));
-    for (const char* unreadable : {"", "***", "zz/zz", "10/zz", "00/15", "-1/15"})
-        EXPECT_EQ(PaperDigits::ofPaper(QString::fromLatin1(unreadable)), std::nullopt) << unreadable;
-}
-
 TEST(PaperResize, scalesToThePaperWithTiesToEvenAndNeverEnlarges) {
     struct Case {
         PictureSize source;
-        PaperDigits paper;
+        PaperSize paper;
         PictureSize target;
     };
-    constexpr PaperDigits small{10, 15};
+    constexpr PaperSize small{10, 15};
     for (const Case& c : {
              Case{{4000, 3000}, small, {1800, 1350}},
              Case{{3000, 4000}, small, {1200, 1600}},

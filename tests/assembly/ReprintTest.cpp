@@ -90,13 +90,13 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
     for (int i = 0; i < 12; ++i) {
         SCOPED_TRACE(lines[i].toStdString());
         EXPECT_TRUE(first[i] == second[i]) << "whatever was under way beside it";
-        const OrderItem item = OrderItem::split(lines[i], OrderItem::Form::Edited);
-        const bool isCorrected = item.record.contains(QLatin1String("RED"));
+        const BasketLine item = BasketLine::split(lines[i], LineForm::Full);
+        const bool isCorrected = item.editState.contains(QLatin1String("RED"));
         const QString source = hostText(isCorrected ? correctedPath(item.path) : item.path);
         const QTemporaryDir out;
         QProcess render;
         render.start(QStringLiteral(LUMORA_RENDER),
-                     {u"print"_s, u"--paper"_s, u"10/15"_s, u"--record"_s, item.record, u"--frames"_s,
+                     {u"print"_s, u"--paper"_s, u"10/15"_s, u"--record"_s, item.editState, u"--frames"_s,
                       hostText(u"C:\\2000lumora\\misgarot"_s), u"--out"_s, out.path(), source});
         ASSERT_TRUE(render.waitForFinished(60000));
         ASSERT_EQ(render.exitCode(), 0) << render.readAllStandardError().constData();

@@ -85,12 +85,9 @@ TEST(TextToHex, CarriesANameThereAndBack) {
     EXPECT_EQ(HexToChars(u"4142zz43"_s), u"AB"_s + QChar(0) + u'C');
 }
 
-TEST(FixedText, PadsNumbersAndFormsSizeCodes) {
+TEST(FixedText, PadsNumbers) {
     EXPECT_EQ(ZeroPadded(7, 4), u"0007"_s);
     EXPECT_EQ(ZeroPadded(12345, 4), u"2345"_s);
-    EXPECT_EQ(SizeCode(u"10/15"_s), u"1015"_s);
-    EXPECT_EQ(SizeCode(u"9/13"_s), u"9/13"_s);
-    EXPECT_EQ(SizeCode(QString()), QString());
 }
 
 } // namespace

@@ -51,14 +51,14 @@ protected:
         ASSERT_TRUE(frame.save(at(name)));
     }
 
-    Bitmap preview(const char* file, const EditFields& edit, PaperDigits paper = {10, 15}) const {
+    Bitmap preview(const char* file, const EditFields& edit, PaperSize paper = {10, 15}) const {
         auto opened = EditedPreview::open(path(file), paper, edit.ZoomPercent,
                                           edit.ToneFlag == 1 ? EditedPreview::Tone::Grey : EditedPreview::Tone::Colour);
         if (!opened)
             return {};
         return opened->render(edit, loadFrame(path("frames"), edit, FrameUse::Preview));
     }
-    Bitmap print(const char* file, const EditFields& edit, PaperDigits digits = {10, 15}) const {
+    Bitmap print(const char* file, const EditFields& edit, PaperSize digits = {10, 15}) const {
         EditedPrint request;
         request.file = path(file);
         request.paper = digits;
@@ -93,7 +93,7 @@ double meanDifference(const Bitmap& seen, const Bitmap& other) {
 TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
     struct Case {
         const char* file;
-        PaperDigits paper;
+        PaperSize paper;
         const char* record;
     };
     const Case cases[] = {

@@ -18,13 +18,11 @@ TEST(PicturePlacement, SizesThePreviewByThePaperCode) {
                           {"3040", {450, 337}, {300, 400}},
                           {"1521", {450, 321}, {300, 420}}};
     for (const Case& expected : cases) {
-        const auto paper = PaperDigits::parse(QString::fromLatin1(expected.code));
+        const auto paper = PaperSize::ofDigits(QString::fromLatin1(expected.code));
         ASSERT_TRUE(paper) << expected.code;
         EXPECT_EQ(previewBox(*paper, PaperOrientation::Landscape), expected.landscape) << expected.code;
         EXPECT_EQ(previewBox(*paper, PaperOrientation::Portrait), expected.portrait) << expected.code;
     }
-    for (const char* unusable : {"zzzz", "zz/zz", "", "10", "    ", "1000", "***"})
-        EXPECT_FALSE(PaperDigits::parse(QString::fromLatin1(unusable))) << unusable;
 }
 
 TEST(PicturePlacement, TakesAPictureFromPreviewToPrint) {

@@ -14,55 +14,8 @@ using namespace Qt::StringLiterals;
 
 const QString path = u"C:\\pics\\תמונה.jpg"_s;
 
-TEST(APrintCode, keepsItsColumnsWhateverItsFieldsHold) {
-    struct Case {
-        PrintCode code;
-        QString text;
-    };
-    for (const Case& c :
-         {Case{{12, u"1015"_s, u'M', u"WB"_s}, u"121015MWB"_s}, Case{{1, {}, u' ', u"WBX"_s}, u"1      WB"_s},
-          Case{{3, u"203040"_s, u'G', {}}, u"3 2030G  "_s}})
-        EXPECT_EQ(c.code.compose(), c.text);
-
-    const PrintCode back = PrintCode::split(u"121015MWBC:\\a.jpg"_s);
-    EXPECT_EQ(back.copies, 12);
-    EXPECT_EQ(back.compose(), u"121015MWB"_s);
-    EXPECT_EQ(PrintCode::copiesOf(QString()), 0);
-}
-
-TEST(APaperLetter, isReadFromTheWordsThatEachPathKnows) {
-    struct Case {
-        QString word;
-        char16_t clicked;
-        char16_t wholeFolder;
-    };
-    for (const Case& c : {Case{u"מט"_s, u'M', u'M'}, Case{u"מבריק"_s, u'G', u'G'}, Case{u"M"_s, u'M', u'M'},
-                          Case{u"Matte"_s, u'M', u'x'}, Case{u"Glossy"_s, u'G', u'x'}, Case{u"***"_s, u'x', u'x'}}) {
-        EXPECT_EQ(paperLetter(c.word, PaperWords::All, u'x'), c.clicked) << c.word.toStdString();
-        EXPECT_EQ(paperLetter(c.word, PaperWords::WholeFolder, u'x'), c.wholeFolder) << c.word.toStdString();
-    }
-}
-
-TEST(ASizeField, hasTheEndsOfThePaperAndIsBlankForASpecialSize) {
-    OrderDetails shemot;
-    shemot.ppr = u"09/13"_s;
-    EXPECT_EQ(sizeField(shemot), u"0913"_s);
-    shemot.ppr = u"zz/zz"_s;
-    EXPECT_EQ(sizeField(shemot), u"    "_s);
-}
-
-TEST(ABasketLine, splitsIntoWhatItWasComposedOfInBothForms) {
-    const BasketLine line{{7, u"1318"_s, u'G', u"NB"_s}, EditRecord::newPicture(), path};
-    EXPECT_EQ(line.compose(LineForm::Short), u"7 1318GNB"_s + path);
-    const QString full = line.compose(LineForm::Full);
-    EXPECT_EQ(full.size(), 209 + path.size());
-    const BasketLine back = BasketLine::split(full, LineForm::Full);
-    EXPECT_EQ(back.path, path);
-    EXPECT_EQ(back.editState, EditRecord::newPicture());
-}
-
 QString plainLine(int copies, const QString& of) {
-    return BasketLine{{copies, u"1015"_s, u'G', u"NB"_s}, {}, of}.compose(LineForm::Short);
+    return BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), {}, of}.compose(LineForm::Short);
 }
 
 TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
@@ -70,7 +23,9 @@ TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
         Basket basket;
         basket.setForm(form);
         const auto add = [&](int copies, const QString& of) {
-            basket.append(BasketLine{{copies, u"1015"_s, u'G', u"NB"_s}, EditRecord::newPicture(), of}.compose(form));
+            basket.append(
+                BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), EditRecord::newPicture(), of}.compose(
+                    form));
         };
         const auto find = [&](const char* of) { return basket.FindByPath(QString::fromLatin1(of)); };
         add(1, u"C:\\a.jpg"_s);

@@ -55,7 +55,7 @@ Exit status: 0 all pictures done, 1 a picture failed (the others are done all th
 
 struct Request {
     enum class Mode { Plain, Small, Preview, Print } mode = Mode::Plain;
-    std::optional<PaperDigits> paper;
+    std::optional<PaperSize> paper;
     EditFields edit;
     fs::path frames;
     std::optional<QColor> background;
@@ -129,7 +129,7 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
                 return refuse("--background " + *value + " is no colour; six hexadecimal digits are wanted, as FF8000");
             request.background = colour;
         } else if (name == "--paper") {
-            request.paper = PaperDigits::ofPaper(QString::fromUtf8(value->c_str()));
+            request.paper = PaperSize::ofText(QString::fromUtf8(value->c_str()));
             if (!request.paper)
                 return refuse("--paper " + *value + " is no paper size; two sides in centimetres are wanted, as 10/15");
         } else if (name == "--size") {

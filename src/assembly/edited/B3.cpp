@@ -7,7 +7,6 @@
 #include "imaging/files/BmpFile.h"
 #include "imaging/files/PictureFile.h"
 #include "order/EditRecord.h"
-#include "order/OrderLog.h"
 #include "order/PrintFileName.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -25,8 +24,8 @@ namespace {
 constexpr int shownForAWhile = 2000; // milliseconds
 constexpr int previewWidth = 300;
 
-OrderItem split(const QString& item) {
-    return OrderItem::split(item, OrderItem::Form::Edited);
+BasketLine split(const QString& item) {
+    return BasketLine::split(item, LineForm::Full);
 }
 
 } // namespace
@@ -40,7 +39,7 @@ B3::~B3() = default;
 void B3::load() {
     takeLines();
     fillList2();
-    m_paper = PaperDigits::ofPaper(m_state.shemot.ppr);
+    m_paper = PaperSize::ofText(m_state.shemot.ppr);
     m_jobFolder = WorkspacePaths::jobFolder(m_state);
     Command1.visible = false;
     Picture5.visible = false;
@@ -110,8 +109,8 @@ bool B3::prepareOrder() {
         return false;
     m_state.transfer.MailFlag = 0;
     CountTotalPics();
-    claimOrderNumber(m_state, m_platform.files, OrderFolder::Ending::Plain);
-    const OrderFolder folder(m_state, OrderFolder::Ending::Plain);
+    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, OrderFolder::Ending::Plain);
+    const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::Plain);
     if (!openFolder(folder))
         return false;
 
@@ -129,7 +128,7 @@ bool B3::prepareOrder() {
     if (!BuildOrderSheet())
         return false;
     setStage(Stage::Closing);
-    return writeLog(folder, editedOrderLog(m_state, List1.items(), List4fail.items(), m_platform.clock.now()));
+    return writeLog(folder, OrderLog::Layout::Edited);
 }
 
 void B3::fillList2() {
@@ -140,7 +139,7 @@ void B3::fillList2() {
 
 void B3::PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints) {
     List2.setCurrentIndex(index);
-    const OrderItem item = split(List1.item(index));
+    const BasketLine item = split(List1.item(index));
     packer.beginStep();
     if (!item.hasUsableName())
         return;
@@ -151,7 +150,7 @@ void B3::PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints)
     packer.removeScratch();
 }
 
-Result<QByteArray> B3::RenderEditedPicture(const OrderItem& item, EditedPrints& prints) {
+Result<QByteArray> B3::RenderEditedPicture(const BasketLine& item, EditedPrints& prints) {
     EditedPrintResult made = prints.next([this] { m_platform.pump.pump(); });
     if (made.toneCopy) {
         if (const Result<void> kept = keepToneCopy(item, *made.toneCopy); !kept) {
@@ -163,9 +162,9 @@ Result<QByteArray> B3::RenderEditedPicture(const OrderItem& item, EditedPrints& 
 }
 
 // The copy of a corrected picture is looked for among the red-eye copies too, under the name of the copy itself.
-Result<void> B3::keepToneCopy(const OrderItem& item, NewContent& copy) {
+Result<void> B3::keepToneCopy(const BasketLine& item, NewContent& copy) {
     EditFields edit;
-    UnpackEditState(item.record, edit);
+    UnpackEditState(item.editState, edit);
     if (Result<void> kept = copy.commit(NewContent::Durability::Passing); !kept)
         return kept;
     if (edit.RedMarker != EditRecord::corrected)
@@ -175,10 +174,10 @@ Result<void> B3::keepToneCopy(const OrderItem& item, NewContent& copy) {
 }
 
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
-void B3::saveThumbnail(const OrderItem& item, const QString& scratch) {
+void B3::saveThumbnail(const BasketLine& item, const QString& scratch) {
     const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
     const QString path =
-        m_jobFolder + u'\\' + item.code.left(2) + u'~' + PrintBaseName(item.path) + QStringLiteral(".bmp");
+        m_jobFolder + u'\\' + item.copiesField() + u'~' + PrintBaseName(item.path) + QStringLiteral(".bmp");
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
     const Result<PictureSize> size = source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch};
     if (!size || !target)

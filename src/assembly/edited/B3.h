@@ -42,12 +42,12 @@ private:
     void fillList2();
     bool prepareOrder();
     void PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints);
-    Result<QByteArray> RenderEditedPicture(const OrderItem& item, EditedPrints& prints);
-    Result<void> keepToneCopy(const OrderItem& item, NewContent& copy);
-    void saveThumbnail(const OrderItem& item, const QString& scratch);
+    Result<QByteArray> RenderEditedPicture(const BasketLine& item, EditedPrints& prints);
+    Result<void> keepToneCopy(const BasketLine& item, NewContent& copy);
+    void saveThumbnail(const BasketLine& item, const QString& scratch);
     bool BuildOrderSheet();
 
-    std::optional<PaperDigits> m_paper; // as it was when the page was loaded
+    std::optional<PaperSize> m_paper; // as it was when the page was loaded
     QString m_jobFolder;
 };
 

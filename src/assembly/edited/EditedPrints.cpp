@@ -35,12 +35,12 @@ EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::pa
 } // namespace
 
 EditedPrints::EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
-                           std::optional<PaperDigits> paper)
+                           std::optional<PaperSize> paper)
     : m_state(state)
     , m_files(files)
     , m_paper(paper) {
     for (const QString& text : items) {
-        OrderItem item = OrderItem::split(text, OrderItem::Form::Edited);
+        BasketLine item = BasketLine::split(text, LineForm::Full);
         if (item.hasUsableName())
             m_items.push_back(std::move(item));
     }
@@ -48,9 +48,9 @@ EditedPrints::EditedPrints(const SessionState& state, const Files& files, const 
                                       [this](int i) { return rendering(m_items[static_cast<std::size_t>(i)]); });
 }
 
-EditedPrints::Ahead::Work EditedPrints::rendering(const OrderItem& item) const {
+EditedPrints::Ahead::Work EditedPrints::rendering(const BasketLine& item) const {
     EditFields edit;
-    UnpackEditState(item.record, edit);
+    UnpackEditState(item.editState, edit);
     const Drives& drives = m_files.drives();
     const QString source =
         edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(m_state, item.path) : item.path;

@@ -4,7 +4,7 @@
 #include "common/HostFile.h"
 #include "common/Result.h"
 #include "editing/render/PicturePlacement.h"
-#include "order/OrderItem.h"
+#include "order/BasketLine.h"
 
 #include <QByteArray>
 #include <QStringList>
@@ -33,7 +33,7 @@ class EditedPrints {
 public:
     // items as List1 holds them. Without a paper every print is a failure.
     EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
-                 std::optional<PaperDigits> paper);
+                 std::optional<PaperSize> paper);
 
     // The next print in the order of the list; calls whileWaiting again and again until it is there.
     template <class Waiting>
@@ -44,12 +44,12 @@ public:
 private:
     using Ahead = WorkAhead<EditedPrintResult>;
 
-    Ahead::Work rendering(const OrderItem& item) const;
+    Ahead::Work rendering(const BasketLine& item) const;
 
     const SessionState& m_state;
     const Files& m_files;
-    const std::optional<PaperDigits> m_paper;
-    std::vector<OrderItem> m_items;
+    const std::optional<PaperSize> m_paper;
+    std::vector<BasketLine> m_items;
     std::unique_ptr<Ahead> m_ahead; // last, so that it ends first
 };
 

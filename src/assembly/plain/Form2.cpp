@@ -4,9 +4,9 @@
 #include "assembly/WorkAhead.h"
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
+#include "order/BasketLine.h"
 #include "order/OrderFolder.h"
-#include "order/OrderItem.h"
-#include "order/OrderLog.h"
+#include "order/OrderNames.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -20,8 +20,8 @@
 namespace lumora {
 namespace {
 
-OrderItem split(const QString& item) {
-    return OrderItem::split(item, OrderItem::Form::Plain);
+BasketLine split(const QString& item) {
+    return BasketLine::split(item, LineForm::Short);
 }
 
 // Either spelling of the camera and no other: what else there is was picked with a whole folder.
@@ -38,7 +38,7 @@ class Form2::Prints {
 public:
     Prints(const SessionState& state, const Files& files, const QStringList& items)
         : m_files(files)
-        , m_paper(PaperDigits::ofPaper(state.shemot.ppr))
+        , m_paper(PaperSize::ofText(state.shemot.ppr))
         , m_sources(state.DchisaAmoka == 1 ? QStringList() : sourcesToScale(items))
         , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
 
@@ -54,7 +54,7 @@ private:
     static QStringList sourcesToScale(const QStringList& items) {
         QStringList sources;
         for (const QString& item : items) {
-            const OrderItem picture = split(item);
+            const BasketLine picture = split(item);
             if (picture.hasUsableName() && !HasQuestionMark(item))
                 sources += picture.path;
         }
@@ -71,7 +71,7 @@ private:
     }
 
     const Files& m_files;
-    const std::optional<PaperDigits> m_paper;
+    const std::optional<PaperSize> m_paper;
     const QStringList m_sources;
     Ahead m_prints;
 };
@@ -227,15 +227,16 @@ void Form2::KeepOnlyJpeg() {
 
 bool Form2::prepareOrder() {
     // Before the sheet is drawn: it shows the number.
-    claimOrderNumber(m_state, m_platform.files, OrderFolder::Ending::BySession);
+    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, OrderFolder::Ending::BySession);
     CountTotalPics();
     if (!drawSheet(sheetKind()))
         return false;
 
-    const OrderFolder folder(m_state, OrderFolder::Ending::BySession);
+    const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::BySession);
     if (!openFolder(folder))
         return false;
-    const QString sheetPath = folder.sheetPath(QStringLiteral(".jpp"));
+    const QString sheetPath =
+        folder.filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, QStringLiteral(".jpp")));
     const Result<QByteArray> sheet = encodeJpeg(Picture5Image, printQuality);
     const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
     if (!saved)
@@ -248,11 +249,11 @@ bool Form2::prepareOrder() {
 
     setStage(Stage::Closing);
     countOrder();
-    return writeLog(folder, plainOrderLog(m_state, List1.items(), List4fail.items(), m_platform.clock.now()));
+    return writeLog(folder, m_state.Optint == OrderKind::Album ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
 }
 
 void Form2::PackOnePicture(int index, PrintPacker& packer, Prints& prints) {
-    const OrderItem item = split(List1.item(index));
+    const BasketLine item = split(List1.item(index));
     packer.beginStep();
     if (!item.hasUsableName())
         return;
@@ -280,7 +281,7 @@ bool Form2::drawSheet(SheetKind kind) {
     std::vector<SheetCell> cells;
     for (const QString& item : List1.items())
         cells.push_back({m_platform.files.drives().toHost(split(item).path),
-                         item.left(2) + u'_' + RightPart(NameWithoutEnding(item), 9)});
+                         split(item).copiesField() + u'_' + RightPart(NameWithoutEnding(item), 9)});
     setStage(Stage::Sheet);
     sheet.drawContactSheet(cells, [&](int i) {
         setStage(Stage::Sheet, i + 1);

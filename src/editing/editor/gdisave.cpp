@@ -1,6 +1,8 @@
 #include "editing/editor/gdisave.h"
 
 #include "imaging/files/PictureFile.h"
+#include "order/OrderFolder.h"
+#include "order/OrderNames.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -104,12 +106,14 @@ void gdisave::Command5_Click() {
 void gdisave::Command6_Click() {
     if (!GdiReady)
         return;
-    const QString sheet =
-        m_state.transfer.OrderFolder + QStringLiteral("\\!") + m_state.MisparHazmana + u'_' + m_state.shemot.ser;
+    const auto save = [this](const QString& ending) {
+        const QString name = SheetName(m_state.MisparHazmana, m_state.shemot.ser, ending);
+        SaveJpeg(PicPic, OrderFolder::chosen(m_state).filePath(name), 90);
+    };
     if (m_state.transfer.SugSheliach == Sender::Ftp)
-        SaveJpeg(PicPic, sheet + QStringLiteral(".jpp"), 90);
+        save(QStringLiteral(".jpp"));
     if (m_state.transfer.SugSheliach == Sender::Http || m_state.TachanaMekomit)
-        SaveJpeg(PicPic, sheet + QStringLiteral(".jpg"), 90);
+        save(QStringLiteral(".jpg"));
 }
 
 void gdisave::Command7_Click() {

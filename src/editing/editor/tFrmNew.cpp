@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
+#include "common/PaperSize.h"
 #include "editing/editor/BigPics.h"
 #include "editing/render/EditedPicture.h"
 #include "order/EditRecord.h"
@@ -39,9 +40,9 @@ tFrmNew::~tFrmNew() = default;
 void tFrmNew::load() {
     // A size without two numbers, as that of an order of mixed sizes, leaves the usual paper.
     const QString code = SizeCode(m_state.shemot.ppr);
-    if (PaperDigits::parse(code))
+    if (PaperSize::ofDigits(code))
         PaperSizeCode = code;
-    PicPicSize = previewBox(*PaperDigits::parse(PaperSizeCode), PaperOrientation::Landscape);
+    PicPicSize = previewBox(*PaperSize::ofDigits(PaperSizeCode), PaperOrientation::Landscape);
 
     for (Caption* hidden : {&Frame3, &Frame4, &Labeltext, &Picture3, &Command10, &Command12, &Command23, &Command24})
         hidden->visible = false;
@@ -149,7 +150,7 @@ bool tFrmNew::loadPictureOfRecord() {
 }
 
 bool tFrmNew::LoadWorkBitmap(const QString& path) {
-    const PaperDigits paper = *PaperDigits::parse(PaperSizeCode);
+    const PaperSize paper = *PaperSize::ofDigits(PaperSizeCode);
     Result<EditedPreview> opened =
         EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {

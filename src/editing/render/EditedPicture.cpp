@@ -152,7 +152,7 @@ std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& 
     return load(u'k' + name);
 }
 
-Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperDigits paper, int zoomPercent, Tone tone,
+Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperSize paper, int zoomPercent, Tone tone,
                                           double largestScale) {
     const auto size = readPictureSize(file);
     if (!size)

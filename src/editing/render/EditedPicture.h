@@ -36,7 +36,7 @@ public:
     // record's tone flag. largestScale: how much larger than the box render() will be asked to draw; that many more
     // pixels are kept where the file has them.
     enum class Tone { Colour, Grey };
-    static Result<EditedPreview> open(const std::filesystem::path& file, PaperDigits paper, int zoomPercent, Tone tone,
+    static Result<EditedPreview> open(const std::filesystem::path& file, PaperSize paper, int zoomPercent, Tone tone,
                                       double largestScale = 1);
 
     PictureSize box() const { return m_box; }
@@ -81,7 +81,7 @@ private:
 
 struct EditedPrint {
     std::filesystem::path file; // the customer's picture or its corrected copy
-    PaperDigits paper;
+    PaperSize paper;
     std::filesystem::path framesFolder;
     Bitmap grey = {};                      // what loadGrey() made of the file, where that was done before
     std::optional<QColor> background = {}; // without it the whole picture, stretched

@@ -28,18 +28,7 @@ PaperOrientation orientationOf(PictureSize picture) {
     return picture.height < picture.width ? PaperOrientation::Landscape : PaperOrientation::Portrait;
 }
 
-std::optional<PaperDigits> PaperDigits::parse(const QString& code) {
-    return code.size() == 4 ? ofPaper(code) : std::nullopt;
-}
-
-std::optional<PaperDigits> PaperDigits::ofPaper(const QString& paper) {
-    const PaperDigits digits{Val16(paper.left(2)), Val16(paper.right(2))};
-    if (digits.shortSide < 1 || digits.longSide < 1)
-        return std::nullopt;
-    return digits;
-}
-
-PictureSize previewBox(PaperDigits paper, PaperOrientation orientation) {
+PictureSize previewBox(PaperSize paper, PaperOrientation orientation) {
     if (orientation == PaperOrientation::Landscape)
         return {450, std::max(1, cut(450.0 * paper.shortSide / paper.longSide))};
     return {300, std::max(1, cut(300.0 * paper.longSide / paper.shortSide))};
@@ -70,7 +59,7 @@ Placement previewPlacement(PictureSize workPicture, PictureSize box, const EditF
     return placement;
 }
 
-PrintGeometry printGeometry(PaperDigits paper, PaperOrientation orientation) {
+PrintGeometry printGeometry(PaperSize paper, PaperOrientation orientation) {
     PrintGeometry print;
     const double shortSide = paper.shortSide;
     const double longSide = paper.longSide;

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "common/PaperSize.h"
 #include "imaging/drawing/PlacedDraw.h"
 #include "imaging/files/PictureFile.h"
-
-#include <QString>
 
 #include <optional>
 
@@ -20,21 +19,9 @@ enum class PaperOrientation { Landscape, Portrait };
 // A square picture counts as portrait.
 PaperOrientation orientationOf(PictureSize picture);
 
-// A paper in whole centimetres.
-struct PaperDigits {
-    int shortSide = 0;
-    int longSide = 0;
-    bool operator==(const PaperDigits&) const = default;
-
-    // From a four-digit paper code, "1015". No value for a text without two usable numbers, as "zz/zz" gives.
-    static std::optional<PaperDigits> parse(const QString& code);
-    // From a paper as the order names it, "10/15": its first two characters and its last two.
-    static std::optional<PaperDigits> ofPaper(const QString& paper);
-};
-
 // The box that stands for the paper: 450 wide in landscape, 300 wide in portrait. The two differ in size on purpose,
 // since positions in the record are in these pixels.
-PictureSize previewBox(PaperDigits paper, PaperOrientation orientation);
+PictureSize previewBox(PaperSize paper, PaperOrientation orientation);
 
 // The work picture that all previews are drawn from: five times the zoom at which it was opened, at most 700, portrait
 // pictures three quarters of that. At least 1 pixel a side; no value for a picture so slim that a side would pass
@@ -50,7 +37,7 @@ struct PrintGeometry {
     double scaleX = 1;
     double scaleY = 1;
 };
-PrintGeometry printGeometry(PaperDigits paper, PaperOrientation orientation);
+PrintGeometry printGeometry(PaperSize paper, PaperOrientation orientation);
 
 Placement printPlacement(PictureSize picture, const PrintGeometry& print, const EditFields& edit);
 

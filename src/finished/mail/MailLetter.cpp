@@ -1,6 +1,5 @@
 #include "finished/mail/MailLetter.h"
 
-#include "order/OrderDetailsReader.h"
 #include "session/SessionState.h"
 
 #include <QStringList>

@@ -1,9 +1,10 @@
 #include "finished/orders/FilesToSend.h"
 
 #include "common/DrivePathText.h"
-#include "order/OrderDetailsReader.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
+#include "order/PrintCode.h"
 
 #include <algorithm>
 
@@ -55,7 +56,7 @@ QStringList FilesToSend::markedNames() const {
 }
 
 std::int16_t FilesToSend::familyCount() const {
-    return CopiesCount(markedNames());
+    return sumOfCopies(markedNames(), CopiesIn::FileNames);
 }
 
 QStringList FilesToSend::markedPaths() const {
@@ -72,7 +73,7 @@ std::optional<QString> FilesToSend::unmarkedSheet() const {
 }
 
 QStringList FilesToSend::resendList() const {
-    const QString text = OrderTextPath(m_folder);
+    const QString text = OrderFolder(m_folder).logPath();
     QStringList list = markedPaths();
     // It may be among the marked files, and a name that stands twice in an order never arrives twice.
     list.removeAll(text);

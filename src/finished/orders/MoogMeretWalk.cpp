@@ -4,7 +4,7 @@
 #include "finished/mail/MailResult.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/OrderDetailsReader.h"
-#include "order/OrderNames.h"
+#include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -188,7 +188,7 @@ void MoogMeret::sendPackage(int index) {
 
 OrderDetails MoogMeret::detailsOf(const QString& folder) const {
     OrderDetails details;
-    const QString text = OrderTextPath(folder);
+    const QString text = OrderFolder(folder).logPath();
     if (m_platform.files.fileExists(text))
         ReadResentDetails(m_platform.files, text, details);
     return details;

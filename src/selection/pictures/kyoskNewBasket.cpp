@@ -50,7 +50,7 @@ void kyoskNew::Picture1_Click(int cell) {
 
 void kyoskNew::AddSimple(int cell) {
     const QString path = List2.item(cell);
-    const QString line = BasketLine{composeCodeOfCell(cell), {}, path}.compose(List1.form());
+    const QString line = BasketLine{composeCodeOfCell(cell).compose(), {}, path}.compose(List1.form());
     Label1.text = path;
     showLarge(path);
     if (const int index = List1.FindByPath9(path); index >= 0)
@@ -64,7 +64,7 @@ void kyoskNew::AddSimple(int cell) {
 
 void kyoskNew::AddForEditor(int cell) {
     const QString path = List2.item(cell);
-    BasketLine line{composeCodeOfCell(cell), {}, path};
+    BasketLine line{composeCodeOfCell(cell).compose(), {}, path};
     m_state.edit.PicturePath = path;
     Label1.text = path;
     if (const int index = List1.FindByPath(path); index >= 0) {
@@ -151,10 +151,11 @@ void kyoskNew::setCopies(int cell, int copies) {
     } else {
         // The rest of a line stays, edits included.
         if (index >= 0)
-            List1.replaceAt(index, PrintCode::copiesField(copies) + List1.item(index).mid(2));
+            List1.replaceAt(index, BasketLine::withCopies(List1.item(index), copies));
         else
             List1.append(
-                BasketLine{composeCode(copies, PaperWords::All), m_state.edit.EditState, path}.compose(List1.form()));
+                BasketLine{composeCode(copies, PaperWords::All).compose(), m_state.edit.EditState, path}.compose(
+                    List1.form()));
         Picture4[at].visible = true;
     }
     SumCopies();
@@ -177,7 +178,7 @@ void kyoskNew::Command11_Click() {
 
 void kyoskNew::AddWholeFolderLine(int index) {
     const QString path = List4.item(index);
-    const QString line = BasketLine{composeCode(1, PaperWords::WholeFolder), {}, path}.compose(List1.form());
+    const QString line = BasketLine{composeCode(1, PaperWords::WholeFolder).compose(), {}, path}.compose(List1.form());
     if (const int found = List1.FindByPath9(path); found >= 0)
         List1.replaceAt(found, line);
     else
@@ -245,7 +246,7 @@ void kyoskNew::ZZvvA_Click() {
         return;
     // The cell may show another picture by now, so that the copies are those of the line.
     const PrintCode code = composeCode(PrintCode::copiesOf(List1.item(index)), PaperWords::All);
-    List1.replaceAt(index, BasketLine{code, m_state.edit.EditState, path}.compose(List1.form()));
+    List1.replaceAt(index, BasketLine{code.compose(), m_state.edit.EditState, path}.compose(List1.form()));
     SumCopies();
     const Result<void> written = HandOverFiles(m_state, m_platform.files).write(List1.lines().items(), index);
     if (!written && !m_handOverFailed)

@@ -1,6 +1,7 @@
 #include "session/lab/SettingsText.h"
 
 #include "common/FixedText.h"
+#include "common/PaperSize.h"
 #include "session/SessionState.h"
 
 namespace lumora {

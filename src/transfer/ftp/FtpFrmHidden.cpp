@@ -1,6 +1,7 @@
 // The hidden area of the sending page: the older bulk path, the chain of orders, the manual panel of the makers, and
 // the routines that nothing calls.
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
 #include "platform/Dialogs.h"
@@ -295,7 +296,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
     File1.setFolder(folder);
     File1.refresh();
     beginList();
-    const QString log = OrderTextPath(folder);
+    const QString log = OrderFolder(folder).logPath();
     if (m_platform.files.fileExists(log))
         List3.append(log);
     for (const QString& entry : File1.names()) {

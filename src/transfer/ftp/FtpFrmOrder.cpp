@@ -3,8 +3,10 @@
 #include "editing/editor/gdisave.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
+#include "order/PrintCode.h"
 #include "platform/Dialogs.h"
 #include "session/PageChain.h"
 #include "session/Workspace.h"
@@ -34,8 +36,7 @@ bool FtpFrm::settingsFound() {
 }
 
 bool FtpFrm::orderIsChosen() const {
-    const QString& folder = m_state.transfer.OrderFolder;
-    return !folder.isEmpty() && folder != notChosen;
+    return OrderFolder::chosen(m_state).isChosen();
 }
 
 void FtpFrm::beginList() {
@@ -43,7 +44,7 @@ void FtpFrm::beginList() {
         list->clear();
     NumToSend = 0;
     m_room->check.NumOnServer = 0;
-    m_state.transfer.ShemTikiya = LeafName(m_state.transfer.OrderFolder);
+    m_state.transfer.ShemTikiya = OrderFolder::chosen(m_state).name();
     if (orderIsChosen())
         Label46.text = m_state.transfer.ShemTikiya;
 }
@@ -59,7 +60,7 @@ void FtpFrm::listFolder() {
     File1.setFolder(folder);
     File1.refresh();
     Label7.text = QString::number(File1.count());
-    const QString log = JoinDrivePath(folder, m_state.transfer.ShemTikiya + QStringLiteral(".txt"));
+    const QString log = OrderFolder(folder).logPath();
     ReadOrderDetails(m_platform.files, log, m_state.shemot);
     ShowOrderSummary();
     // The order text always travels ahead of the pictures.
@@ -90,7 +91,7 @@ void FtpFrm::CountOrderPictures() {
     List8.clear();
     for (const QString& path : List3.items())
         List8.append(LeafName(path));
-    m_state.shemot.TotalPics = CopiesCount(List8.items());
+    m_state.shemot.TotalPics = sumOfCopies(List8.items(), CopiesIn::FileNames);
     Label21.text = QString::number(m_state.shemot.TotalPics);
 }
 
@@ -145,11 +146,10 @@ void FtpFrm::Command1_Click() {
     List3.append(m_handedOver);
     Label7.text = QString::number(List3.count());
     const QString& folder = m_state.transfer.OrderFolder;
-    ReadResentDetails(m_platform.files, JoinDrivePath(folder, m_state.transfer.ShemTikiya + QStringLiteral(".txt")),
-                      m_state.shemot);
+    ReadResentDetails(m_platform.files, OrderFolder(folder).logPath(), m_state.shemot);
     ShowOrderSummary();
     addProofPicture();
-    for (const QString& path : ReadBrokenFiles(m_platform.files, folder)) {
+    for (const QString& path : ReadBrokenFiles(m_platform.files, OrderFolder(folder))) {
         if (List3.contains(path))
             List4Broken.append(path);
     }

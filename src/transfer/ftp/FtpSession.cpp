@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "order/BrokenFiles.h"
+#include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "platform/files/Files.h"
 #include "transfer/delivery/LineTrouble.h"
@@ -232,7 +233,7 @@ bool FtpSession::EnterOrderFolder() {
         return false;
     }
     QString& name = m_desk.state.transfer.ShemTikiya;
-    name = LeafName(m_desk.state.transfer.OrderFolder);
+    name = OrderFolder::chosen(m_desk.state).name();
     if (m_board.List5.contains(name)) {
         if (!enterListedFolder(name))
             return false;
@@ -299,7 +300,7 @@ bool FtpSession::FtpSendFile(const QString& path) {
 
 void FtpSession::keepBrokenFiles() {
     const auto written =
-        WriteBrokenFiles(m_desk.platform.files, m_desk.state.transfer.OrderFolder, m_board.List4Broken);
+        WriteBrokenFiles(m_desk.platform.files, OrderFolder::chosen(m_desk.state), m_board.List4Broken);
     if (!written && !std::exchange(m_noListKeptTold, true))
         m_desk.platform.dialogs.message(written.failure().message);
 }

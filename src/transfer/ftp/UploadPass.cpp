@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "order/BrokenFiles.h"
+#include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "transfer/delivery/UploadProgress.h"
 
@@ -96,7 +97,7 @@ void UploadPass::UploadOneFile(const QString& path) {
     m_board.Label2.visible = false;
     m_board.File1Enabled.enabled = false;
     m_board.Command12.visible = false;
-    m_board.Label46.text = LeafName(m_desk.state.transfer.OrderFolder);
+    m_board.Label46.text = OrderFolder::chosen(m_desk.state).name();
     m_desk.StopFlag = false;
     m_session.PauseBar(2);
     m_session.reconnect(captions());

@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
+#include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -165,7 +166,7 @@ void UploadForm::pump() {
 }
 
 QString UploadForm::folderName() const {
-    return LeafName(m_state.transfer.OrderFolder);
+    return OrderFolder::chosen(m_state).name();
 }
 
 QString UploadForm::siteAddress(const QString& rest) const {

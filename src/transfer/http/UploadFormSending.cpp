@@ -1,6 +1,7 @@
 // The sending itself: attempts, the files on their way, and what the server says of them.
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "order/OrderReport.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -225,7 +226,7 @@ void UploadForm::HttpFetchFileListN(int listNumber) {
     if (m_left)
         return;
     // The list of an earlier check would pass for the answer of this one.
-    const QString list = JoinDrivePath(m_state.transfer.OrderFolder, ListFileName(0));
+    const QString list = OrderFolder::chosen(m_state).filePath(ListFileName(0));
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)
         m_listFailure = cleared.failure();
@@ -255,11 +256,11 @@ QString UploadForm::FetchUrl(const QString& url) {
 
 // The answers are not looked at: the order is on the server already.
 void UploadForm::HttpSendReport() {
-    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state));
+    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot));
 }
 
 void UploadForm::HttpSendDone() {
-    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state));
+    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state.profile, m_state.transfer));
 }
 
 void UploadForm::Command1_Click() {

@@ -1,0 +1,121 @@
+#include "order/BrokenFiles.h"
+#include "order/OrderDetailsReader.h"
+#include "order/OrderFolder.h"
+#include "order/OrderReport.h"
+#include "session/TextList.h"
+#include "support/ExampleOrder.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+SessionState orderOfDana() {
+    SessionState state = exampleOrder();
+    state.profile.ClientCode = u"tarvelmond"_s;
+    state.transfer.ShemTikiya = u"2026_11_21_KUP_1234^105"_s;
+    return state;
+}
+
+const QString reportOfDana =
+    u"?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    10_15G_FIT_NB&t2=Notes: gift - &t3=Pratim: 03-1234567    Dana "
+    "Levi&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"_s;
+
+TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
+    SessionState state = orderOfDana();
+    EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), reportOfDana);
+    EXPECT_EQ(DoneQuery(state.profile, state.transfer), u"?t1=tarvelmond&t2=true"_s);
+    state.transfer.SugMishloah = Sending::Resend;
+    EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), reportOfDana);
+    state.transfer.SugMishloah = Sending::Chain;
+    EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), QString());
+    EXPECT_EQ(DoneQuery(state.profile, state.transfer), QString());
+}
+
+TEST(OrderReport, KeepsEveryCharacterButLineBreaksAndOverlapsTheEndsOfAShortPaperText) {
+    SessionState state = orderOfDana();
+    state.shemot.Hearot = u"a&b#c%20\r\nGET /"_s + QChar(u'\0') + u'x';
+    state.shemot.ppr = u"9/5"_s;
+    state.shemot.maat.clear();
+    const QString query = OrderReportQuery(state.profile, state.transfer, state.shemot);
+    EXPECT_TRUE(query.contains(u"Notes: a&b#c%20  GET / x&t3="_s));
+    EXPECT_TRUE(query.contains(u"    9/_/5_FIT_NB&"_s));
+}
+
+TEST(OrderReport, KnowsThePaperKindsOfBothLanguages) {
+    for (const QString& word : {u"מט"_s, u"MAT"_s, u"Matte"_s})
+        EXPECT_EQ(PaperKindLetter(word), u"M"_s) << word.toStdString();
+    for (const QString& word : {u"מבריק"_s, u"GLOSSY"_s, u"Glossy"_s})
+        EXPECT_EQ(PaperKindLetter(word), u"G"_s) << word.toStdString();
+    for (const QString& word : {QString(), u"***"_s, u"M"_s})
+        EXPECT_EQ(PaperKindLetter(word), QString()) << word.toStdString();
+}
+
+TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
+    TestPlatform test;
+    const QString path = u"C:\\log.txt"_s;
+    (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"Shemot.n1\",\"a, \"b\" c\"\r\n\"Shemot.TotalPics\",13\r\n"
+                                      "\"Shemot.n3\",\"elsewhere\"\r\n\"Shemot.Hearot\",\"\"\r\nrubbish\r\n");
+    OrderDetails details;
+    details.n2 = u"03"_s;
+    details.n3 = u"street"_s;
+    details.Hearot = u"old"_s;
+    ReadOrderDetails(test.files, path, details);
+    EXPECT_EQ(details.n1, u"a, \"b\" c"_s);
+    EXPECT_EQ(details.n2, u"03"_s);
+    EXPECT_EQ(details.n3, u"street"_s);
+    EXPECT_EQ(details.Hearot, QString());
+    EXPECT_EQ(details.TotalPics, 13);
+}
+
+TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAgain) {
+    TestPlatform test;
+    const QString path = u"C:\\log.txt"_s;
+    (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
+                                      "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
+    OrderDetails details; // a new album has no customer, and the address may have been mended since
+    details.Mail = u"as corrected@example.com"_s;
+    details.Bord = u"NB"_s;
+    ReadOrderDetails(test.files, path, details);
+    EXPECT_EQ(details.n1, QString());
+    EXPECT_EQ(details.Mail, u"as corrected@example.com"_s);
+    EXPECT_EQ(details.TotalPics, 0);
+    ReadResentDetails(test.files, path, details);
+    EXPECT_EQ(details.n1, u"Studio Or"_s);
+    EXPECT_EQ(details.ppr, u"30/60"_s);
+    EXPECT_EQ(details.Mail, u"studio@example.com"_s);
+    EXPECT_EQ(details.Bord, QString()) << "of another order";
+    EXPECT_EQ(details.TotalPics, 14);
+}
+
+TEST(ReadOrderDetails, SaysSoWhenThereIsNoLog) {
+    TestPlatform test;
+    OrderDetails details;
+    details.TotalPics = 4;
+    ReadOrderDetails(test.files, u"C:\\none.txt"_s, details);
+    for (const QString& text : {details.n1, details.n2, details.ppr, details.Hearot, details.Mail, details.FillFit,
+                                details.maat, details.Bord})
+        EXPECT_EQ(text, u"NO details"_s);
+    EXPECT_EQ(details.TotalPics, 0);
+}
+
+TEST(BrokenFiles, ComeBackAsTheyWereWritten) {
+    TestPlatform test;
+    TextList broken;
+    broken.append(u"C:\\תמונות\\a.jpp"_s);
+    broken.append(u"C:\\b.jpp"_s);
+    ASSERT_TRUE(WriteBrokenFiles(test.files, OrderFolder(u"C:"_s), broken));
+    EXPECT_EQ(ReadBrokenFiles(test.files, OrderFolder(u"C:\\"_s)), broken.items());
+    EXPECT_TRUE(IsBroken(broken, u"b.jpp"_s));
+    EXPECT_FALSE(IsBroken(broken, u"B.jpp"_s));
+    EXPECT_TRUE(ReadBrokenFiles(test.files, OrderFolder(u"C:\\none"_s)).isEmpty());
+    const auto written = WriteBrokenFiles(test.files, OrderFolder(u"C:\\none"_s), broken);
+    ASSERT_FALSE(written);
+    EXPECT_TRUE(written.failure().message.contains(u"kashloo.txt"_s));
+}
+
+} // namespace
+} // namespace lumora
