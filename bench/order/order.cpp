@@ -245,7 +245,7 @@ int peakMemory(Kind kind, int pictures) {
     clear.close();
     int last = 0;
     const Times times = bench.order(pictures, [&](const PreparationPage& page) {
-        const int at = page.Label17.text.toInt();
+        const int at = page.controls().Label17.text.toInt();
         if (at != last && at > 0 && at % std::max(1, pictures / 6) == 0)
             std::printf("picture %3d: %.0f MiB, most %.0f\n", at, memory("VmRSS:"), memory("VmHWM:"));
         last = at;

@@ -19,29 +19,18 @@ PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform&
     , m_platform(platform)
     , m_chain(chain) {}
 
-QString PreparationPage::doNotDelete(const SessionState& state) {
-    return state.wording(u"אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת",
-                         u"If you mean to delete the pictures from the computer, the camera or any other "
-                         "medium,");
-}
-
-QString PreparationPage::untilPrinted(const SessionState& state) {
-    return state.wording(u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות",
-                         u"do not delete them until you hold the printed pictures in your hands");
-}
-
 bool PreparationPage::takeLines() {
-    List1.append(std::exchange(m_state.handOver.lines, {}));
+    shared().List1.append(std::exchange(m_state.handOver.lines, {}));
     return std::exchange(m_state.handOver.pressStart, false);
 }
 
-void PreparationPage::CountTotalPics() {
-    m_state.shemot.TotalPics = sumOfCopies(List1.items(), CopiesIn::BasketLines);
-    Label5.text = QString::number(m_state.shemot.TotalPics);
+void PreparationPage::countTotal() {
+    m_state.shemot.TotalPics = sumOfCopies(controls().List1.items(), CopiesIn::BasketLines);
+    shared().Label5.text = QString::number(m_state.shemot.TotalPics);
 }
 
 bool PreparationPage::somethingChosen() {
-    if (!List1.isEmpty())
+    if (!controls().List1.isEmpty())
         return true;
     setStage(Stage::Waiting);
     tell(QStringLiteral("לא נבחרו תמונות"), QStringLiteral("No pictures were chosen"));
@@ -49,59 +38,32 @@ bool PreparationPage::somethingChosen() {
 }
 
 void PreparationPage::setPreparing(bool on) {
-    preparing = on;
+    m_preparing = on;
     Q_EMIT changed();
 }
 
 void PreparationPage::setStage(Stage stage, int position) {
     m_stage = stage;
-    progressValue = position;
-    progressMaximum = List1.count();
+    m_position = position;
+    m_count = controls().List1.count();
     if (stage != Stage::Pictures)
-        Label4Picture.text.clear();
+        shared().Label4Picture.text.clear();
     showProgress();
     Q_EMIT changed();
 }
 
-void PreparationPage::showProgress() {
-    const QString position = QString::number(progressValue);
-    const QString count = QString::number(progressMaximum);
-    Label16.text = count;
-    Label17.text = m_stage == Stage::Pictures ? position : QString();
-    switch (m_stage) {
-    case Stage::Waiting:
-        Label4Progress.text = m_state.wording(u"ההזמנה עוד לא הוכנה", u"The order is not prepared yet");
-        break;
-    case Stage::Checking:
-        Label4Progress.text = m_state.wording(u"בודק את רשימת התמונות", u"Checking the list of pictures");
-        break;
-    case Stage::Sheet:
-        Label4Progress.text =
-            m_state.wording(u"מצייר את דף ההזמנה: תמונה %1 מתוך %2", u"Drawing the order sheet: picture %1 of %2")
-                .arg(position, count);
-        break;
-    case Stage::Pictures:
-        Label4Progress.text =
-            m_state
-                .wording(u"מכין תמונה מספר %1 מתוך %2 תמונות שבחרת", u"Preparing picture %1 of the %2 that you chose")
-                .arg(position, count);
-        break;
-    case Stage::Closing:
-        Label4Progress.text = m_state.wording(u"רושם את פרטי ההזמנה", u"Writing down the order's details");
-        break;
-    case Stage::Done:
-        Label4Progress.text = m_state.wording(u"ההזמנה מוכנה", u"The order is ready");
-        break;
-    }
-    Label4fail.visible = !List4fail.isEmpty();
-    Label4fail.text = m_state.wording(u"%1 תמונות לא ניתן היה להכין:", u"Pictures that could not be prepared: %1")
-                          .arg(List4fail.count());
+double PreparationPage::share() const {
+    return m_count > 0 ? static_cast<double>(m_position) / m_count : 0;
 }
 
 void PreparationPage::addFailed(const QString& path) {
-    List4fail.append(path);
+    shared().List4fail.append(path);
     showProgress();
     Q_EMIT changed();
+}
+
+void PreparationPage::takeNumber(OrderFolder::Ending ending) {
+    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, ending);
 }
 
 bool PreparationPage::openFolder(const OrderFolder& folder) {
@@ -115,8 +77,8 @@ bool PreparationPage::openFolder(const OrderFolder& folder) {
 }
 
 bool PreparationPage::forEachPicture(const std::function<void(int)>& step) {
-    for (int i = 0; i < List1.count(); ++i) {
-        List1.setCurrentIndex(i);
+    for (int i = 0; i < controls().List1.count(); ++i) {
+        shared().List1.setCurrentIndex(i);
         setStage(Stage::Pictures, i + 1);
         step(i);
         if (!yield())
@@ -155,7 +117,8 @@ void PreparationPage::countOrder() {
 
 bool PreparationPage::writeLog(const OrderFolder& folder, OrderLog::Layout layout) {
     const QByteArray log =
-        OrderLog::of(m_state, layout, List1.items(), List4fail.items(), m_platform.clock.now()).write();
+        OrderLog::of(m_state, layout, controls().List1.items(), controls().List4fail.items(), m_platform.clock.now())
+            .write();
     if (const Result<void> logged = m_platform.files.writeWhole(folder.logPath(), log); !logged) {
         tell(QStringLiteral("לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."),
              QStringLiteral(
@@ -171,20 +134,22 @@ bool PreparationPage::writeLog(const OrderFolder& folder, OrderLog::Layout layou
 void PreparationPage::handOver(Outcome prepared) {
     m_handedOver = true;
     m_state.transfer.SugMishloah = Sending::NewOrder;
-    const QString kept =
-        m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
-            .arg(m_state.MisparHazmana);
-    if (prepared == Outcome::KeptAtStation)
-        m_state.handOver.notice = kept;
-    if (!m_chain.canFollow(id(), prepared)) {
+    const bool goesOn = m_chain.canFollow(id(), prepared);
+    if (!goesOn)
         tell(QStringLiteral("ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."),
              QStringLiteral("The order is ready, but this version has no page to go on with it."),
              m_state.transfer.OrderFolder);
-        m_state.handOver.notice = kept;
+    if (!goesOn || prepared == Outcome::KeptAtStation)
+        m_state.handOver.notice =
+            m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
+                .arg(m_state.MisparHazmana);
+    if (!m_chain.follow(id(), prepared))
         m_chain.unload(id());
-        return;
-    }
-    m_chain.follow(id(), prepared);
+}
+
+void PreparationPage::leaveProgram() {
+    m_chain.endProgram();
+    m_chain.unload(id());
 }
 
 void PreparationPage::tell(const QString& hebrew, const QString& english, const QString& reason) {

@@ -7,52 +7,63 @@
 #include "order/OrderLog.h"
 #include "session/Caption.h"
 #include "session/Page.h"
+#include "session/PageFlow.h"
 #include "session/TextList.h"
 
 #include <functional>
-#include <optional>
 
 namespace lumora {
 
 struct Platform;
 struct SessionState;
 class PageChain;
-enum class Outcome;
 
-// What the two pages share that turn a basket into an order folder: the list with its progress, the loop over the
-// pictures, what is written behind it, the hand-over to a sender, and the words for all that can go wrong.
+// The controls that both preparation pages have.
+struct PreparationControls : Controls {
+    TextList List1{*this, u"List1"};                  // the lines of the basket
+    TextList List4fail{*this, u"List4fail"};          // paths that could not be prepared
+    Caption Label5{*this, u"Label5"};                 // copies in all
+    Caption Label17{*this, u"Label17"};               // position of the picture in work, from 1; empty before the first
+    Caption Label16{*this, u"Label16"};               // how many pictures there are
+    Caption Label4Progress{*this, u"Label4Progress"}; // what is happening, with position and count
+    Caption Label4Picture{*this, u"Label4Picture"};   // file name of the picture in work
+    Caption Label4fail{*this, u"Label4fail"};         // how many could not be prepared; hidden when all could
+    Caption Picture5{*this, u"Picture5", Caption::At::Hidden}; // the order sheet's box
+    Bitmap Picture5Image;
+};
+
+// What the two pages share that turn a basket into an order folder (Form2, B3): the list with its progress, the loop
+// over the pictures, what is written behind it, the hand-over to a sender, and the words for all that can go wrong.
 class PreparationPage : public Page {
     Q_OBJECT
 public:
     // State
-    TextList List1;         // the lines of the basket
-    TextList List4fail;     // paths of the pictures that could not be prepared
-    Caption Label5;         // copies in all
-    Caption Label17;        // position of the picture in work, from 1; empty before the first
-    Caption Label16;        // how many pictures there are
-    Caption Label4Progress; // a sentence: what is happening, with position and count
-    Caption Label4Picture;  // file name of the picture in work
-    Caption Label4fail;     // a sentence: how many could not be prepared; hidden when all could
-    Caption Picture5;       // the order sheet's box
-    Bitmap Picture5Image;
-    int progressMaximum = 0; // for a bar: as Label16 and Label17
-    int progressValue = 0;
-    bool preparing = false;
-
-    // The two lines of the warning not to delete the pictures yet.
-    static QString doNotDelete(const SessionState& state);
-    static QString untilPrinted(const SessionState& state);
+    const PreparationControls& controls() const override = 0;
+    bool isPreparing() const { return m_preparing; }
+    // How far the work has come, 0 to 1, and the position and the count in words for a gauge.
+    double share() const;
+    QString positionText() const { return QString::number(m_position); }
+    QString countText() const;
+    QString totalText() const;
+    // What List1 is called where it is not seen.
+    QString listText() const;
+    bool isSheetShown() const { return controls().Picture5.visible && !controls().Picture5Image.isNull(); }
 
 protected:
     PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain);
+
+    virtual PreparationControls& shared() = 0;
 
     enum class Stage { Waiting, Checking, Sheet, Pictures, Closing, Done };
 
     // Takes the lines of the hand-over; answers whether the page before asks for the start.
     bool takeLines();
-    void CountTotalPics();
+    void countTotal();
     // False, with words, when there is nothing to prepare.
     bool somethingChosen();
+    // The two lines of the warning not to delete the pictures yet.
+    QString doNotDelete() const;
+    QString untilPrinted() const;
 
     // While it is on no button starts anything.
     virtual void setPreparing(bool on);
@@ -61,7 +72,9 @@ protected:
     virtual void showProgress();
     void addFailed(const QString& path);
 
-    // The folder of the order, told to the senders too. False, with words, when it can't be made.
+    // Takes a number that is free and opens its folder, which the senders are told too. No value, with words, when the
+    // folder can't be made.
+    void takeNumber(OrderFolder::Ending ending);
     bool openFolder(const OrderFolder& folder);
     // step() for each line of List1, the page painted behind each. False when a click ended the program.
     bool forEachPicture(const std::function<void(int)>& step);
@@ -72,9 +85,10 @@ protected:
     // False, with words: without its log an order does not leave.
     bool writeLog(const OrderFolder& folder, OrderLog::Layout layout);
 
-    // The order is whole: shows the page that goes on with it, or none at a local station, and leaves.
+    // The order is whole: the page flow has the page that goes on with it, and this one is left.
     void handOver(Outcome prepared);
     bool handedOver() const { return m_handedOver; }
+    void leaveProgram();
 
     void tell(const QString& hebrew, const QString& english, const QString& reason = {});
     // Lets the page paint and a click through. False when that click ended the program.
@@ -87,6 +101,9 @@ protected:
 
 private:
     Stage m_stage = Stage::Waiting;
+    int m_position = 0;
+    int m_count = 0;
+    bool m_preparing = false;
     bool m_handedOver = false;
 };
 

@@ -213,13 +213,13 @@ TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPreparesAndCountsAfterTh
     machine.pump.onPump = [&] {
         page.Command5_Click();
         page.Timer2_Tick();
-        if (page.Label17.text.isEmpty())
+        if (page.controls().Label17.text.isEmpty())
             return;
         countedEarly = countedEarly || exists(u"C:\\vedron\\mispar.txt"_s) || exists(logPath());
-        if (positions.value(positions.size() - 1) != page.Label17.text)
-            positions += page.Label17.text;
-        EXPECT_EQ(page.List2.currentIndex() + 1, page.Label17.text.toInt());
-        EXPECT_EQ(page.Label16.text, u"2"_s);
+        if (positions.value(positions.size() - 1) != page.controls().Label17.text)
+            positions += page.controls().Label17.text;
+        EXPECT_EQ(page.controls().List2.currentIndex() + 1, page.controls().Label17.text.toInt());
+        EXPECT_EQ(page.controls().Label16.text, u"2"_s);
     };
     page.Timer2_Tick();
     machine.pump.onPump = {};
@@ -235,7 +235,7 @@ TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
         items += edited(givePicture(u"picture%1.jpg"_s.arg(i)), record(toned));
     B3& page = open(items);
     machine.pump.onPump = [&] {
-        if (page.Label17.text == u"3"_s)
+        if (page.controls().Label17.text == u"3"_s)
             page.Command2_Click();
     };
     page.Timer2_Tick();

@@ -50,7 +50,7 @@ protected:
     // The paths that failed.
     QStringList prepare(const QStringList& items) {
         B3& page = open(items);
-        const TextList& failed = page.List4fail;
+        const TextList& failed = page.controls().List4fail;
         page.Timer2_Tick();
         return failed.items();
     }

@@ -40,7 +40,7 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
 TEST_F(PreparingAPlainOrder, startsByItselfOnceItIsShownIfThePageBeforeAsksForIt) {
     state.handOver.pressStart = true;
     Form2& page = openWith({line(givePicture(u"IMG_1.jpg"_s))});
-    EXPECT_FALSE(page.preparing) << "painted first";
+    EXPECT_FALSE(page.isPreparing()) << "painted first";
     for (const QDeadlineTimer limit(20000); front() != PageId::FtpFrm && !limit.hasExpired();)
         QCoreApplication::processEvents();
     EXPECT_EQ(front(), PageId::FtpFrm);
@@ -60,7 +60,7 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
         makeFolder(nothing);
         const QString second = deep == 1 ? nothing : giveFile(u"second.jpg"_s, cutShort);
         Form2& page = openWith({line(first), line(second), line(third)});
-        const TextList& failed = page.List4fail;
+        const TextList& failed = page.controls().List4fail;
         page.Command6_Click();
 
         const QString number = state.MisparHazmana;
@@ -91,7 +91,7 @@ TEST_F(PreparingAPlainOrder, skipsShortNamesInSilenceAndFailsNamesOutsideTheCode
     const QString tooShort = givePicture(u"ajpg"_s);
     const QString unknown = u"C:\\pics\\????.jpg"_s;
     Form2& page = openWith({line(tooShort, u"5 "_s), line(unknown, u"2 "_s), line(good)});
-    const TextList& failed = page.List4fail;
+    const TextList& failed = page.controls().List4fail;
     page.Command6_Click();
     EXPECT_EQ(failed.items(), QStringList(unknown));
     EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0002_016162636465.jpp"_s));
@@ -102,8 +102,8 @@ TEST_F(PreparingAPlainOrder, dropsWhatIsNoJpegInTwoWalksThatPassOverTheItemBehin
     const QString jpg = line(givePicture(u"a1.jpg"_s));
     const auto other = [](int i) { return line(u"C:\\pics\\x%1.png"_s.arg(i)); };
     Form2& page = openWith({other(1), other(2), other(3), other(4), other(5), jpg});
-    const TextList& left = page.List1;
-    const TextList& removed = page.List4removed;
+    const TextList& left = page.controls().List1;
+    const TextList& removed = page.controls().List4removed;
     page.Command3_Click();
     EXPECT_EQ(left.items(), QStringList({other(4), jpg}));
     EXPECT_EQ(removed.count(), 4);
@@ -111,23 +111,23 @@ TEST_F(PreparingAPlainOrder, dropsWhatIsNoJpegInTwoWalksThatPassOverTheItemBehin
 }
 
 TEST_F(PreparingAPlainOrder, saysSoWhenNothingIsLeftAndTakesNoNumber) {
-    Form2& page = openWith({});
-    page.Command6_Click();
+    openWith({}).Command6_Click();
     EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
-    page.List1.append(QStringList({line(u"C:\\pics\\a.txt"_s), line(u"C:\\pics\\b.Jpg"_s)}));
+    chain.unload(PageId::Form2);
+    Form2& page = openWith({line(u"C:\\pics\\a.txt"_s), line(u"C:\\pics\\b.Jpg"_s)});
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2) << "empty only in the second walk";
     EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_s));
     EXPECT_FALSE(machine.files.folderExists(folder()));
-    EXPECT_FALSE(page.preparing);
-    EXPECT_TRUE(page.Command3.enabled);
+    EXPECT_FALSE(page.isPreparing());
+    EXPECT_TRUE(page.controls().Command3.enabled);
 }
 
 TEST_F(PreparingAPlainOrder, takesNoSecondPressAndNoRemovalWhileItPrepares) {
     Form2& page = openWith({line(givePicture(u"one.jpg"_s)), line(givePicture(u"two.jpg"_s))});
     bool enabledMeanwhile = false;
     machine.pump.onPump = [&] {
-        enabledMeanwhile = enabledMeanwhile || page.Command1.enabled || page.Command3.enabled || page.Command6.enabled;
+        enabledMeanwhile = enabledMeanwhile || page.controls().Command1.enabled || page.controls().Command3.enabled || page.controls().Command6.enabled;
         page.Command3_Click();
         page.Command6_Click();
         page.Command1_Click();
@@ -147,7 +147,7 @@ TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
         items += line(givePicture(u"pic%1.jpg"_s.arg(i)));
     Form2& page = openWith(items);
     machine.pump.onPump = [&] {
-        if (page.Label17.text == u"3"_s)
+        if (page.controls().Label17.text == u"3"_s)
             page.Command7_Click();
     };
     page.Command3_Click();
@@ -207,7 +207,7 @@ TEST_F(PreparingAPlainOrder, tellsOfAPrintFileThatCanNotBeWrittenAndGoesOn) {
     const QString one = givePicture(u"one.jpg"_s);
     makeFolder(folder() + u"\\1 1015GNB0000_016F6E65.jpp"_s);
     Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
-    const TextList& failed = page.List4fail;
+    const TextList& failed = page.controls().List4fail;
     page.Command6_Click();
     EXPECT_EQ(failed.items(), QStringList(one));
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
@@ -236,12 +236,12 @@ TEST_F(PreparingAPlainOrder, goesOnWithoutTheCounterButNotWithoutTheLog) {
 
 TEST_F(PreparingAPlainOrder, saysItsTextsInTheLanguageOfTheSession) {
     Form2& page = openWith({line(givePicture(u"one.jpg"_s))});
-    EXPECT_EQ(page.Label10.text, u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות"_s);
+    EXPECT_EQ(page.controls().Label10.text, u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות"_s);
     state.EnglishTips = 1;
     page.setTexts();
-    for (const Caption* caption : {&page.Label1, &page.Label4Progress, &page.Label4fail, &page.Label4removed,
-                                   &page.Label6, &page.Label10, &page.Command1, &page.Command3, &page.Command4,
-                                   &page.Command5, &page.Command6, &page.Command7, &page.Command8, &page.Picture5}) {
+    for (const Caption* caption : {&page.controls().Label1, &page.controls().Label4Progress, &page.controls().Label4fail, &page.controls().Label4removed,
+                                   &page.controls().Label6, &page.controls().Label10, &page.controls().Command1, &page.controls().Command3, &page.controls().Command4,
+                                   &page.controls().Command5, &page.controls().Command6, &page.controls().Command7, &page.controls().Command8, &page.controls().Picture5}) {
         EXPECT_FALSE(caption->text.isEmpty());
         for (const QChar letter : caption->text)
             EXPECT_NE(letter.script(), QChar::Script_Hebrew) << caption->text.toStdString();

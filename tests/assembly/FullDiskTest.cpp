@@ -28,7 +28,7 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
             ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limit), 0);
         }
         Form2& page = openWith(items);
-        const TextList& failed = page.List4fail;
+        const TextList& failed = page.controls().List4fail;
         page.Command3_Click();
         ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &before), 0);
 

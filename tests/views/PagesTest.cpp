@@ -179,7 +179,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     QTimer middle;
     bool looked = false;
     QObject::connect(&middle, &QTimer::timeout, &middle, [&] {
-        if (page.Label17.text.toInt() < 5)
+        if (page.controls().Label17.text.toInt() < 5)
             return;
         middle.stop();
         looked = true;

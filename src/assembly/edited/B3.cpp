@@ -24,25 +24,19 @@ namespace {
 constexpr int shownForAWhile = 2000; // milliseconds
 constexpr int previewWidth = 300;
 
-BasketLine split(const QString& item) {
-    return BasketLine::split(item, LineForm::Full);
-}
-
 } // namespace
 
 B3::B3(SessionState& state, const Platform& platform, PageChain& chain)
     : PreparationPage(PageId::B3, state, platform, chain)
-    , Timer2(shownForAWhile, [this] { Timer2_Tick(); }) {}
+    , Timer2(shownForAWhile, [this] { prepare(); }) {}
 
 B3::~B3() = default;
 
 void B3::load() {
     takeLines();
-    fillList2();
+    listNames();
     m_paper = PaperSize::ofText(m_state.shemot.ppr);
     m_jobFolder = WorkspacePaths::jobFolder(m_state);
-    Command1.visible = false;
-    Picture5.visible = false;
     setStage(Stage::Waiting);
     Timer2.start();
 }
@@ -50,8 +44,8 @@ void B3::load() {
 void B3::setTexts() {
     const SessionState& s = m_state;
     Label4Title.text = s.wording(u"הכנת תמונות למשלוח", u"Preparing your pictures");
-    Label1.text = doNotDelete(m_state);
-    Label2.text = untilPrinted(m_state);
+    Label1.text = doNotDelete();
+    Label2.text = untilPrinted();
     Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
     Command5.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
     // The same button in the two languages of the page.
@@ -64,15 +58,10 @@ void B3::setTexts() {
     Q_EMIT changed();
 }
 
-void B3::Timer2_Tick() {
+void B3::prepare() {
     Timer2.stop();
-    Command5_Click();
-}
-
-void B3::Command5_Click() {
-    if (preparing || handedOver())
+    if (isPreparing() || handedOver())
         return;
-    Timer2.stop();
     setPreparing(true);
     const bool made = yield() && prepareOrder();
     if (m_chain.hasEnded())
@@ -87,14 +76,9 @@ void B3::Command5_Click() {
         handOver(m_state.transfer.SugSheliach == Sender::Http ? Outcome::PreparedForHttp : Outcome::PreparedForFtp);
 }
 
-void B3::Command2_Click() {
-    Command7_Click();
-}
-
-void B3::Command7_Click() {
+void B3::stopAndLeave() {
     Timer2.stop();
-    m_chain.endProgram();
-    m_chain.unload(PageId::B3);
+    leaveProgram();
 }
 
 bool B3::prepareOrder() {
@@ -108,52 +92,52 @@ bool B3::prepareOrder() {
     if (!somethingChosen())
         return false;
     m_state.transfer.MailFlag = 0;
-    CountTotalPics();
-    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, OrderFolder::Ending::Plain);
+    countTotal();
+    takeNumber(OrderFolder::Ending::Plain);
     const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::Plain);
     if (!openFolder(folder))
         return false;
 
-    fillList2();
+    listNames();
     List1.setCurrentIndex(0);
     PrintPacker packer(m_state, m_platform.files, folder, OrderTail::shortWidth);
     {
         EditedPrints prints(m_state, m_platform.files, List1.items(), m_paper);
-        if (!forEachPicture([&](int i) { PrepareOnePicture(i, packer, prints); }))
+        if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
             return false;
     }
 
     setStage(Stage::Closing);
     countOrder();
-    if (!BuildOrderSheet())
+    if (!buildOrderSheet())
         return false;
     setStage(Stage::Closing);
     return writeLog(folder, OrderLog::Layout::Edited);
 }
 
-void B3::fillList2() {
+void B3::listNames() {
     List2.clear();
     for (const QString& item : List1.items())
         List2.append(LeafName(item));
 }
 
-void B3::PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints) {
+void B3::preparePicture(int index, PrintPacker& packer, EditedPrints& prints) {
     List2.setCurrentIndex(index);
-    const BasketLine item = split(List1.item(index));
+    const BasketLine line = BasketLine::split(List1.item(index), LineForm::Full);
     packer.beginStep();
-    if (!item.hasUsableName())
+    if (!line.hasUsableName())
         return;
-    Label4Picture.text = LeafName(item.path);
+    Label4Picture.text = LeafName(line.path);
     Q_EMIT changed();
-    if (pack(packer, {index, item.code, item.path}, [&] { return RenderEditedPicture(item, prints); }))
-        saveThumbnail(item, packer.scratch());
+    if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
+        saveThumbnail(line, packer.scratch());
     packer.removeScratch();
 }
 
-Result<QByteArray> B3::RenderEditedPicture(const BasketLine& item, EditedPrints& prints) {
+Result<QByteArray> B3::renderPicture(const BasketLine& line, EditedPrints& prints) {
     EditedPrintResult made = prints.next([this] { m_platform.pump.pump(); });
     if (made.toneCopy) {
-        if (const Result<void> kept = keepToneCopy(item, *made.toneCopy); !kept) {
+        if (const Result<void> kept = keepToneCopy(line, *made.toneCopy); !kept) {
             tellWriteFailure(kept.failure());
             return kept.failure();
         }
@@ -162,9 +146,9 @@ Result<QByteArray> B3::RenderEditedPicture(const BasketLine& item, EditedPrints&
 }
 
 // The copy of a corrected picture is looked for among the red-eye copies too, under the name of the copy itself.
-Result<void> B3::keepToneCopy(const BasketLine& item, NewContent& copy) {
+Result<void> B3::keepToneCopy(const BasketLine& line, NewContent& copy) {
     EditFields edit;
-    UnpackEditState(item.editState, edit);
+    UnpackEditState(line.editState, edit);
     if (Result<void> kept = copy.commit(NewContent::Durability::Passing); !kept)
         return kept;
     if (edit.RedMarker != EditRecord::corrected)
@@ -174,10 +158,10 @@ Result<void> B3::keepToneCopy(const BasketLine& item, NewContent& copy) {
 }
 
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
-void B3::saveThumbnail(const BasketLine& item, const QString& scratch) {
+void B3::saveThumbnail(const BasketLine& line, const QString& scratch) {
     const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
     const QString path =
-        m_jobFolder + u'\\' + item.copiesField() + u'~' + PrintBaseName(item.path) + QStringLiteral(".bmp");
+        m_jobFolder + u'\\' + line.copiesField() + u'~' + PrintBaseName(line.path) + QStringLiteral(".bmp");
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
     const Result<PictureSize> size = source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch};
     if (!size || !target)
@@ -193,8 +177,8 @@ void B3::saveThumbnail(const BasketLine& item, const QString& scratch) {
     static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
 }
 
-bool B3::BuildOrderSheet() {
-    CountTotalPics();
+bool B3::buildOrderSheet() {
+    countTotal();
     List1.setCurrentIndex(0);
     OrderSheet sheet(SheetKind::Edited, orderSheetSize(SheetKind::Edited, List1.count()),
                      orderSheetBackground(SheetKind::Edited, m_state));

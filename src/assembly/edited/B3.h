@@ -2,17 +2,30 @@
 
 #include "assembly/PreparationPage.h"
 #include "assembly/edited/EditedPrints.h"
-#include "editing/render/PicturePlacement.h"
+#include "common/PaperSize.h"
 #include "session/Ticker.h"
 
 #include <optional>
 
 namespace lumora {
 
-// The preparation of an edited order: each picture is rendered with all that its record says and packed into a print
-// file of the order folder; the order sheet is drawn from the rendered prints. It takes the lines of the hand-over when
-// it loads and starts by itself once it was seen for two seconds.
-class B3 : public PreparationPage {
+// The lines of List1 are print code (9), edit record (200) and path.
+struct B3Controls : PreparationControls {
+    TextList List2{*this, u"List2"};            // file names of the pictures, the one in work current
+    Caption Label4Title{*this, u"Label4Title"}; // title of the page
+    Caption Label1{*this, u"Label1"};           // the warning not to delete the pictures yet, two lines
+    Caption Label2{*this, u"Label2"};
+    Caption Command1{*this, u"Command1", Caption::At::Hidden};
+    Caption Command2{*this, u"Command2"};
+    Caption Command5{*this, u"Command5"};
+    Caption Command7{*this, u"Command7"};
+    Bitmap Picture3; // the print of the picture in work, 300 wide
+};
+
+// Preparing an edited order ("B3" in the glossary): the customer waits while each picture is rendered with all that its
+// record says and packed into a print file of the order folder; the order sheet is drawn from the rendered prints. The
+// page takes the lines of the hand-over when it loads and starts by itself once it was seen for two seconds.
+class B3 : public PreparationPage, private B3Controls {
     Q_OBJECT
 public:
     B3(SessionState& state, const Platform& platform, PageChain& chain);
@@ -22,30 +35,30 @@ public:
     void setTexts() override;
 
     // Events
-    void Timer2_Tick();    // once, presses Command5
-    void Command5_Click(); // the whole preparation, and the hand-over to the sender
-    void Command2_Click(); // both leave the program at once, with the folder as it is
-    void Command7_Click();
+    void Timer2_Tick() { prepare(); }
+    void Command5_Click() { prepare(); }
+    void Command2_Click() { stopAndLeave(); }
+    void Command7_Click() { stopAndLeave(); }
     void Command1_Click() {} // a button that does nothing; it is not shown
 
-    // State, beside what both preparation pages have; the lines of List1 are print code (9), edit record (200) and path
-    TextList List2;      // file names of the pictures, the one in work current
-    Bitmap Picture3;     // the print of the picture in work, 300 wide
-    Caption Label4Title; // title of the page
-    Caption Label1;      // the warning not to delete the pictures yet, two lines
-    Caption Label2;
-    Caption Command1, Command2, Command5, Command7;
+    // State
+    const B3Controls& controls() const override { return *this; }
+    bool isPrintShown() const { return !Picture5.visible && !Picture3.isNull(); }
+
     Ticker Timer2;
 
 private:
+    PreparationControls& shared() override { return *this; }
     void setPreparing(bool on) override;
-    void fillList2();
+    void prepare();
+    void stopAndLeave();
+    void listNames();
     bool prepareOrder();
-    void PrepareOnePicture(int index, PrintPacker& packer, EditedPrints& prints);
-    Result<QByteArray> RenderEditedPicture(const BasketLine& item, EditedPrints& prints);
-    Result<void> keepToneCopy(const BasketLine& item, NewContent& copy);
-    void saveThumbnail(const BasketLine& item, const QString& scratch);
-    bool BuildOrderSheet();
+    void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
+    Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
+    Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
+    void saveThumbnail(const BasketLine& line, const QString& scratch);
+    bool buildOrderSheet();
 
     std::optional<PaperSize> m_paper; // as it was when the page was loaded
     QString m_jobFolder;

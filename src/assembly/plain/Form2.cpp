@@ -20,8 +20,8 @@
 namespace lumora {
 namespace {
 
-BasketLine split(const QString& item) {
-    return BasketLine::split(item, LineForm::Short);
+BasketLine split(const QString& line) {
+    return BasketLine::split(line, LineForm::Short);
 }
 
 // Either spelling of the camera and no other: what else there is was picked with a whole folder.
@@ -83,19 +83,16 @@ Form2::~Form2() = default;
 
 void Form2::load() {
     if (takeLines())
-        QTimer::singleShot(0, this, &Form2::Command3_Click);
-    Command6.visible = false;
-    Command4.visible = m_state.Optint == OrderKind::Album;
-    Picture5.visible = false;
-    Command5.visible = Command8.visible = false;
+        QTimer::singleShot(0, this, &Form2::start);
+    Command4.visible = isAlbum();
     setStage(Stage::Waiting);
 }
 
 void Form2::setTexts() {
     const SessionState& s = m_state;
     Label1.text = s.wording(u"מארז תמונות", u"Preparing your pictures");
-    Label6.text = doNotDelete(m_state);
-    Label10.text = untilPrinted(m_state);
+    Label6.text = doNotDelete();
+    Label10.text = untilPrinted();
     Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
     Command3.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
     Command4.text = s.wording(u"הצג דף אלבום", u"Show the album sheet");
@@ -108,27 +105,27 @@ void Form2::setTexts() {
     Q_EMIT changed();
 }
 
-void Form2::Command3_Click() {
-    if (preparing || handedOver())
+void Form2::start() {
+    if (isPreparing() || handedOver())
         return;
     setPreparing(true);
     setStage(Stage::Checking);
-    KeepOnlyJpeg();
+    keepOnlyJpeg();
     const bool goOn = yield();
     setPreparing(false);
     if (goOn)
-        Command6_Click();
+        prepare();
 }
 
-void Form2::Command6_Click() {
-    if (preparing || handedOver())
+void Form2::prepare() {
+    if (isPreparing() || handedOver())
         return;
     List4fail.clear();
     if (!somethingChosen())
         return;
     m_state.transfer.MailFlag = 0;
     m_writeFailures = 0;
-    KeepOnlyJpeg();
+    keepOnlyJpeg();
     if (!somethingChosen())
         return;
     List1.setCurrentIndex(0);
@@ -146,75 +143,29 @@ void Form2::Command6_Click() {
         return;
     }
     const bool toFinishedOrders = m_state.TmunatPaar == 1 && m_state.Optint == OrderKind::Sequence;
-    if (toFinishedOrders && m_chain.canFollow(PageId::Form2, Outcome::PreparedForLater))
+    if (toFinishedOrders && m_chain.canFollow(id(), Outcome::PreparedForLater))
         m_state.handOver.lines = {m_state.transfer.OrderLogBase};
     handOver(toFinishedOrders ? Outcome::PreparedForLater : Outcome::PreparedForFtp);
 }
 
-void Form2::Command1_Click() {
-    if (preparing || List1.currentIndex() < 0)
+void Form2::removeChosen() {
+    if (isPreparing() || List1.currentIndex() < 0)
         return;
     List1.removeAt(List1.currentIndex());
-    CountTotalPics();
+    countTotal();
     Q_EMIT changed();
 }
 
-void Form2::Command7_Click() {
-    m_chain.endProgram();
-    m_chain.unload(PageId::Form2);
-}
-
-void Form2::Command4_Click() {
-    if (preparing)
-        return;
-    setPreparing(true);
-    CountTotalPics();
-    const bool goOn = drawSheet(SheetKind::Album);
-    setPreparing(false);
-    if (goOn)
-        setStage(Stage::Waiting);
-}
-
-void Form2::Command5_Click() {
-    if (preparing)
-        return;
-    setPreparing(true);
-    const bool goOn = drawSheet(sheetKind());
-    setPreparing(false);
-    if (goOn)
-        setStage(Stage::Waiting);
-}
-
-void Form2::Command8_Click() {
-    Picture5Position = {5, 5};
-    Q_EMIT changed();
-}
-
-void Form2::List1_Click(int index) {
-    if (preparing)
+void Form2::choose(int index) {
+    if (isPreparing())
         return;
     List1.setCurrentIndex(index);
     Q_EMIT changed();
 }
 
-void Form2::Picture5_MouseDown(QPoint at) {
-    m_dragFrom = at - Picture5Position;
-}
-
-void Form2::Picture5_MouseMove(QPoint at) {
-    if (!m_dragFrom)
-        return;
-    Picture5Position = at - *m_dragFrom;
-    Q_EMIT changed();
-}
-
-void Form2::Picture5_MouseUp() {
-    m_dragFrom.reset();
-}
-
 // The walk steps on after a removal, so that the item behind a removed one is not looked at until the next walk: the
 // lab knows the lists that come of it. Start walks twice.
-void Form2::KeepOnlyJpeg() {
+void Form2::keepOnlyJpeg() {
     for (int i = 0; i < List1.count(); ++i) {
         if (isJpegItem(List1.item(i)))
             continue;
@@ -227,9 +178,9 @@ void Form2::KeepOnlyJpeg() {
 
 bool Form2::prepareOrder() {
     // Before the sheet is drawn: it shows the number.
-    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, OrderFolder::Ending::BySession);
-    CountTotalPics();
-    if (!drawSheet(sheetKind()))
+    takeNumber(OrderFolder::Ending::BySession);
+    countTotal();
+    if (!drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain))
         return false;
 
     const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::BySession);
@@ -244,34 +195,34 @@ bool Form2::prepareOrder() {
 
     PrintPacker packer(m_state, m_platform.files, folder, m_state.SugTzad);
     Prints prints(m_state, m_platform.files, List1.items());
-    if (!forEachPicture([&](int i) { PackOnePicture(i, packer, prints); }))
+    if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
         return false;
 
     setStage(Stage::Closing);
     countOrder();
-    return writeLog(folder, m_state.Optint == OrderKind::Album ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
+    return writeLog(folder, isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
 }
 
-void Form2::PackOnePicture(int index, PrintPacker& packer, Prints& prints) {
-    const BasketLine item = split(List1.item(index));
+void Form2::packPicture(int index, PrintPacker& packer, Prints& prints) {
+    const BasketLine line = split(List1.item(index));
     packer.beginStep();
-    if (!item.hasUsableName())
+    if (!line.hasUsableName())
         return;
     // What the selection page leaves of a name that the code page can't carry.
     if (HasQuestionMark(List1.item(index))) {
-        addFailed(item.path);
+        addFailed(line.path);
         return;
     }
-    Label4Picture.text = LeafName(item.path);
+    Label4Picture.text = LeafName(line.path);
     Q_EMIT changed();
-    pack(packer, {index, item.code, item.path}, [&] {
-        return m_state.DchisaAmoka == 1 ? m_platform.files.read(item.path)
+    pack(packer, {index, line.code, line.path}, [&] {
+        return m_state.DchisaAmoka == 1 ? m_platform.files.read(line.path)
                                         : prints.next([this] { m_platform.pump.pump(); });
     });
 }
 
-SheetKind Form2::sheetKind() const {
-    return m_state.Optint == OrderKind::Album ? SheetKind::Album : SheetKind::Plain;
+bool Form2::isAlbum() const {
+    return m_state.Optint == OrderKind::Album;
 }
 
 bool Form2::drawSheet(SheetKind kind) {
@@ -296,6 +247,7 @@ bool Form2::drawSheet(SheetKind kind) {
 void Form2::setPreparing(bool on) {
     for (Caption* button : {&Command1, &Command3, &Command4, &Command5, &Command6})
         button->enabled = !on;
+    Command3.visible = !on;
     PreparationPage::setPreparing(on);
 }
 

@@ -23,17 +23,17 @@ PreparationView::PreparationView(PreparationPage& page, const SessionState& stat
     column->addStretch(1);
     m_gauge = new Gauge(theme, this);
     column->addWidget(m_gauge, 6, Qt::AlignCenter);
-    auto* progress = label(u"Label4Progress"_s, page.Label4Progress, "title");
+    auto* progress = label(u"Label4Progress"_s, page.controls().Label4Progress, "title");
     progress->setAlignment(Qt::AlignCenter);
     column->addWidget(progress);
-    auto* picture = label(u"Label4Picture"_s, page.Label4Picture, "muted");
+    auto* picture = label(u"Label4Picture"_s, page.controls().Label4Picture, "muted");
     picture->setAlignment(Qt::AlignCenter);
     column->addWidget(picture);
     m_trouble = new QFrame(this);
     setRole(m_trouble, "notice");
     m_troubleColumn = new QVBoxLayout(m_trouble);
     m_troubleColumn->setContentsMargins(theme.px(18), theme.px(12), theme.px(18), theme.px(12));
-    m_troubleColumn->addWidget(label(u"Label4fail"_s, page.Label4fail, "strong"));
+    m_troubleColumn->addWidget(label(u"Label4fail"_s, page.controls().Label4fail, "strong"));
     column->addWidget(m_trouble);
     column->addStretch(1);
     auto* keep = new QFrame(this);
@@ -59,10 +59,10 @@ PreparationView::PreparationView(PreparationPage& page, const SessionState& stat
     m_total = makeLabel(this, "large");
     m_total->setWordWrap(false);
     frame().addStatus(m_total);
-    bind(u"Label5"_s, m_total, [this] { return m_page.Label5.text; });
-    bindHidden(u"Label16"_s, page.Label16);
-    bindHidden(u"Label17"_s, page.Label17);
-    bindList(u"List4fail"_s, page.List4fail);
+    bind(u"Label5"_s, m_total, [this] { return m_page.controls().Label5.text; });
+    bindHidden(u"Label16"_s, page.controls().Label16);
+    bindHidden(u"Label17"_s, page.controls().Label17);
+    bindList(u"List4fail"_s, page.controls().List4fail);
 }
 
 PreparationView::Card PreparationView::addCard(int stretch) {
@@ -77,26 +77,24 @@ PreparationView::Card PreparationView::addCard(int stretch) {
 void PreparationView::addSheet(int stretch) {
     const Card card = addCard(stretch);
     m_sheetCard = card.frame;
-    card.column->addWidget(label(u"Picture5Title"_s, m_page.Picture5, "smallMuted"));
+    card.column->addWidget(label(u"Picture5Title"_s, m_page.controls().Picture5, "smallMuted"));
     m_sheet = new PictureBox(theme(), m_sheetCard);
     m_sheet->setMinimumHeight(theme().px(150));
-    bind(u"Picture5"_s, m_sheet, m_page.Picture5);
+    bind(u"Picture5"_s, m_sheet, m_page.controls().Picture5);
     card.column->addWidget(m_sheet, 1);
 }
 
 void PreparationView::renderProgress(const QString& title) {
     frame().setTitle(title);
-    const int all = m_page.progressMaximum;
-    const double share = all > 0 ? static_cast<double>(m_page.progressValue) / all : 0;
-    m_gauge->show(share, QString::number(m_page.progressValue),
-                  all > 0 ? wording(u"מתוך %1"_s, u"of %1"_s).arg(all) : QString());
-    m_gauge->setAccessibleName(m_page.Label4Progress.text.isEmpty() ? title : m_page.Label4Progress.text);
-    m_total->setVisible(!m_page.Label5.text.isEmpty());
-    m_total->setText(wording(u"תמונות להדפסה: %1"_s, u"Prints: %1"_s).arg(m_page.Label5.text));
-    m_sheet->setPicture(m_page.Picture5Image.image());
-    m_sheetCard->setVisible(m_page.Picture5.visible && !m_page.Picture5Image.isNull());
-    speak(m_sheet, m_page.Picture5.text);
-    m_trouble->setVisible(m_page.Label4fail.visible);
+    const PreparationControls& shown = m_page.controls();
+    m_gauge->show(m_page.share(), m_page.positionText(), m_page.countText());
+    m_gauge->setAccessibleName(shown.Label4Progress.text.isEmpty() ? title : shown.Label4Progress.text);
+    m_total->setVisible(!m_page.totalText().isEmpty());
+    m_total->setText(m_page.totalText());
+    m_sheet->setPicture(shown.Picture5Image.image());
+    m_sheetCard->setVisible(m_page.isSheetShown());
+    speak(m_sheet, shown.Picture5.text);
+    m_trouble->setVisible(shown.Label4fail.visible);
 }
 
 } // namespace lumora

@@ -1,0 +1,67 @@
+// The wording that both preparation pages share, in both languages.
+#include "assembly/PreparationPage.h"
+#include "session/SessionState.h"
+
+namespace lumora {
+
+QString PreparationPage::doNotDelete() const {
+    return m_state.wording(u"אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת",
+                           u"If you mean to delete the pictures from the computer, the camera or any other "
+                           "medium,");
+}
+
+QString PreparationPage::untilPrinted() const {
+    return m_state.wording(u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות",
+                           u"do not delete them until you hold the printed pictures in your hands");
+}
+
+QString PreparationPage::countText() const {
+    return m_count > 0 ? m_state.wording(u"מתוך %1", u"of %1").arg(m_count) : QString();
+}
+
+QString PreparationPage::totalText() const {
+    const QString& copies = controls().Label5.text;
+    return copies.isEmpty() ? QString() : m_state.wording(u"תמונות להדפסה: %1", u"Prints: %1").arg(copies);
+}
+
+QString PreparationPage::listText() const {
+    return m_state.wording(u"התמונות שבהזמנה", u"The pictures of the order");
+}
+
+void PreparationPage::showProgress() {
+    PreparationControls& on = shared();
+    const QString position = QString::number(m_position);
+    const QString count = QString::number(m_count);
+    const auto say = [&](const char16_t* hebrew, const char16_t* english) {
+        on.Label4Progress.text = m_state.wording(hebrew, english);
+    };
+    on.Label16.text = count;
+    on.Label17.text = m_stage == Stage::Pictures ? position : QString();
+    switch (m_stage) {
+    case Stage::Waiting:
+        say(u"ההזמנה עוד לא הוכנה", u"The order is not prepared yet");
+        break;
+    case Stage::Checking:
+        say(u"בודק את רשימת התמונות", u"Checking the list of pictures");
+        break;
+    case Stage::Sheet:
+        say(u"מצייר את דף ההזמנה: תמונה %1 מתוך %2", u"Drawing the order sheet: picture %1 of %2");
+        break;
+    case Stage::Pictures:
+        say(u"מכין תמונה מספר %1 מתוך %2 תמונות שבחרת", u"Preparing picture %1 of the %2 that you chose");
+        break;
+    case Stage::Closing:
+        say(u"רושם את פרטי ההזמנה", u"Writing down the order's details");
+        break;
+    case Stage::Done:
+        say(u"ההזמנה מוכנה", u"The order is ready");
+        break;
+    }
+    if (m_stage == Stage::Sheet || m_stage == Stage::Pictures)
+        on.Label4Progress.text = on.Label4Progress.text.arg(position, count);
+    on.Label4fail.visible = !on.List4fail.isEmpty();
+    on.Label4fail.text = m_state.wording(u"%1 תמונות לא ניתן היה להכין:", u"Pictures that could not be prepared: %1")
+                             .arg(on.List4fail.count());
+}
+
+} // namespace lumora
