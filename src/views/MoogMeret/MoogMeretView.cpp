@@ -20,20 +20,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-struct Card {
-    QFrame* frame;
-    QVBoxLayout* column;
-};
-
-Card makeCard(const Theme& theme, QWidget* parent, const char* role) {
-    auto* frame = new QFrame(parent);
-    setRole(frame, role);
-    auto* column = new QVBoxLayout(frame);
-    column->setContentsMargins(theme.px(16), theme.px(14), theme.px(16), theme.px(14));
-    column->setSpacing(theme.px(8));
-    return {frame, column};
-}
-
 // A row answers to a touch and to Enter alike.
 template <class F>
 void whenPicked(QListWidget* list, F handler) {
@@ -69,7 +55,7 @@ QString MoogMeretView::orderRow(const QString& folderName) const {
 }
 
 QWidget* MoogMeretView::makeOrders() {
-    const auto [card, column] = makeCard(theme(), this, "card");
+    const auto [card, column] = makeCard("card", Pad::Normal);
     m_ordersCard = card;
     column->addWidget(label(u"Label4Shalav1"_s, m_page.Label4Shalav1, "strong"));
     m_orders = new QListWidget(card);
@@ -105,7 +91,7 @@ QWidget* MoogMeretView::makeHint() {
 
 QWidget* MoogMeretView::makeFiles() {
     // The messages call it the yellow window.
-    const auto [card, column] = makeCard(theme(), this, "notice");
+    const auto [card, column] = makeCard("notice", Pad::Normal);
     m_files = card;
     bind(u"Picture2"_s, m_files, m_page.Picture2);
     column->addWidget(label(u"Label4Shalav2"_s, m_page.Label4Shalav2, "strong"));
@@ -174,7 +160,7 @@ QWidget* MoogMeretView::makeWalk() {
         u"Label13"_s, m_page.Label13, Role::Plain, [this] { m_page.Label13_Click(); }, u"clock"_s);
     column->addWidget(m_minutes, 0, Qt::AlignCenter);
 
-    const auto [answer, words] = makeCard(theme(), m_walk, "card");
+    const auto [answer, words] = makeCard("card", Pad::Normal);
     m_answer = answer;
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().px(14));

@@ -6,6 +6,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 CaptionField::CaptionField(Handlers handlers, QWidget* parent)
     : QLineEdit(parent)
     , m_handlers(std::move(handlers)) {
@@ -17,7 +19,7 @@ CaptionField::CaptionField(Handlers handlers, QWidget* parent)
 
 void CaptionField::showCaption(const QString& text) {
     QString shown = text;
-    shown.replace(QLatin1String("\r\n"), QStringLiteral(" \u21B5 ")).remove(u'\r').remove(u'\n');
+    shown.replace(u"\r\n"_s, u" \u21B5 "_s).remove(u'\r').remove(u'\n');
     // Without a mark of its own a line that begins in Hebrew would turn over.
     shown.prepend(QChar(0x200E));
     if (shown == this->text())

@@ -1,11 +1,12 @@
 #pragma once
 
-#include "imaging/Bitmap.h"
-#include "views/kit/Theme.h"
+#include "views/kit/Painting.h"
 
 #include <QAbstractButton>
 #include <QImage>
 #include <QWidget>
+
+#include <functional>
 
 namespace lumora {
 
@@ -16,7 +17,7 @@ public:
     CardButton(const Theme& theme, QWidget* parent);
 
     // Of a 1024 by 768 window.
-    void setCardSize(double width, double height);
+    void setCardSize(QSizeF size);
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
 
@@ -42,6 +43,7 @@ protected:
     void paintInside(QPainter& painter, const QRectF& room) override;
 
 private:
+    void paintDisc(QPainter& painter, const QRectF& disc) const;
     void paintUpright(QPainter& painter, const QRectF& room);
 
     QString m_icon;
@@ -49,45 +51,28 @@ private:
     bool m_marked = false;
 };
 
-// A paper size, drawn in its true proportions. The text is the size, "10/15".
-class PaperCard : public CardButton {
-    Q_OBJECT
-public:
-    using CardButton::CardButton;
-
-protected:
-    void paintInside(QPainter& painter, const QRectF& room) override;
-};
-
-// A choice that is told by a small drawing and a word.
+// A choice that is told by a drawing and by its words below it.
 class DrawingCard : public CardButton {
     Q_OBJECT
 public:
-    enum class Drawing { Matte, Glossy, Fit, Fill };
-    DrawingCard(const Theme& theme, QWidget* parent, Drawing drawing);
+    using Drawing = std::function<void(QPainter& painter, const QRectF& place, const QString& words)>;
+    enum class Words { Strong, Small, Size }; // a size, "10/15", runs from left to right
+    // Size of a 1024 by 768 window.
+    DrawingCard(const Theme& theme, QWidget* parent, Drawing drawing, QSizeF size, Words words = Words::Strong);
+
+    // The colour of the ribbon that hangs from the card; none until it is set.
+    void setRibbon(QColor colour);
 
 protected:
     void paintInside(QPainter& painter, const QRectF& room) override;
 
 private:
     Drawing m_drawing;
+    Words m_words;
+    QColor m_ribbon;
 };
 
-// A border around a sample picture, by the border's code.
-class BorderCard : public CardButton {
-    Q_OBJECT
-public:
-    BorderCard(const Theme& theme, QWidget* parent, QString code);
-    static void drawSample(QPainter& painter, const QRectF& room, const QString& code);
-
-protected:
-    void paintInside(QPainter& painter, const QRectF& room) override;
-
-private:
-    QString m_code;
-};
-
-// The same sample picture, large.
+// A border around the sample picture, by the border's code, large.
 class BorderSample : public QWidget {
     Q_OBJECT
 public:
@@ -117,12 +102,5 @@ private:
     QImage m_picture;
     QPixmap m_scaled; // for the size that is on the screen
 };
-
-// A landscape with a sun: the picture in all drawings of the program.
-void drawSamplePicture(QPainter& painter, const QRectF& box);
-
-// The same as a print on paper of this finish.
-enum class PaperFinish { Glossy, Matte, Silk };
-void drawSamplePrint(QPainter& painter, const QRectF& paper, PaperFinish finish);
 
 } // namespace lumora

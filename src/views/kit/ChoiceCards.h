@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QStringList>
 #include <QWidget>
 
 #include <functional>
@@ -10,7 +11,6 @@ class QGridLayout;
 namespace lumora {
 
 class CardButton;
-class TextList;
 class Theme;
 
 // The rows of a list as large cards of which one is chosen: a choice that a person sees whole, where a drop-down list
@@ -22,7 +22,8 @@ public:
     using Maker = std::function<CardButton*(int row)>;
     ChoiceCards(const Theme& theme, QWidget* parent, int columns, Maker maker);
 
-    void display(const TextList& list);
+    // current -1: none is chosen.
+    void display(const QStringList& rows, int current);
     // The card of the row with this text, null when there is none.
     QAbstractButton* card(const QString& text) const;
 

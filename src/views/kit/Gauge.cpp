@@ -1,11 +1,14 @@
 #include "views/kit/Gauge.h"
 
+#include "views/kit/Painting.h"
+
 #include <QFontMetrics>
-#include <QPainter>
 
 #include <algorithm>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 Gauge::Gauge(const Theme& theme, QWidget* parent)
     : QWidget(parent)
@@ -54,11 +57,8 @@ void Gauge::paintEvent(QPaintEvent*) {
         painter.drawArc(ring, 90 * 16, -static_cast<int>(m_share * 360 * 16));
     if (m_mood != Mood::Busy) {
         const int size = static_cast<int>(side * 0.5);
-        const QString sign = m_mood == Mood::Good  ? QStringLiteral("tick")
-                             : m_mood == Mood::Bad ? QStringLiteral("warning")
-                                                   : QStringLiteral("pause");
-        painter.drawPixmap(QPointF(ring.center().x() - size / 2.0, ring.center().y() - size / 2.0),
-                           m_theme.icon(sign, size, colour));
+        const QString sign = m_mood == Mood::Good ? u"tick"_s : m_mood == Mood::Bad ? u"warning"_s : u"pause"_s;
+        drawIcon(painter, ring.center(), m_theme.icon(sign, size, colour));
         return;
     }
     QFont font = m_theme.font(Theme::Type::Display);

@@ -1,7 +1,6 @@
 #include "views/kit/Overlay.h"
 
 #include "views/kit/Keyboard.h"
-#include "views/kit/PageFrame.h"
 
 #include <QApplication>
 #include <QEvent>
@@ -14,15 +13,32 @@ namespace lumora {
 
 Overlay::Overlay(const Theme& theme, QWidget* parent)
     : QWidget(parent)
+    , Maker(theme, this)
     , m_theme(theme) {
     hide();
-    m_card = new QFrame(this);
-    setRole(m_card, "card");
-    m_column = new QVBoxLayout(m_card);
-    m_column->setContentsMargins(theme.px(32), theme.px(28), theme.px(32), theme.px(28));
-    m_column->setSpacing(theme.px(16));
+    const Card card = makeCard("card", Pad::Wide, Space::Wide);
+    m_card = card.frame;
+    m_column = card.column;
     setFocusPolicy(Qt::StrongFocus);
     parent->installEventFilter(this);
+}
+
+void Overlay::addRow(std::initializer_list<Item> items, Space gap) const {
+    m_column->addLayout(inRow(gap, items));
+}
+
+void Overlay::addButtons(QWidget* back, QWidget* main, First first) {
+    addRow({back, Item::room(), main});
+    setFirstFocus(first == First::Main ? main : back);
+}
+
+void Overlay::addButton(QWidget* only, Qt::Alignment side) {
+    m_column->addWidget(only, 0, side);
+    setFirstFocus(only);
+}
+
+void Overlay::whenEscaped(std::function<void()> handler) {
+    connect(this, &Overlay::escaped, this, [handler = std::move(handler)] { handler(); });
 }
 
 void Overlay::setCardWidth(double width) {
@@ -73,7 +89,7 @@ void Overlay::cutCard() {
 }
 
 void Overlay::place() {
-    const int room = m_theme.px(24);
+    const int room = m_theme.margin();
     const QSize available = size() - QSize(2 * room, 2 * room);
     QSize wanted = available;
     if (!m_filling) {

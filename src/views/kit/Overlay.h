@@ -1,18 +1,15 @@
 #pragma once
 
-#include "views/kit/Theme.h"
+#include "views/kit/Maker.h"
 
 #include <QPointer>
 #include <QWidget>
-
-class QFrame;
-class QVBoxLayout;
 
 namespace lumora {
 
 // A panel over a page: a veil over everything below, a card in the middle, and the keyboard kept inside while it is
 // open.
-class Overlay : public QWidget {
+class Overlay : public QWidget, protected Maker {
     Q_OBJECT
 public:
     // Covers parent and follows its size. Closed at first.
@@ -24,6 +21,12 @@ public:
     void setReveal(double share);
     QVBoxLayout* column() const { return m_column; }
     QFrame* card() const { return m_card; }
+    void addRow(std::initializer_list<Item> items, Space gap = Space::Normal) const;
+    // The last row: the way back at its beginning, what goes on at its end. One of the two has the keyboard first.
+    enum class First { Back, Main };
+    void addButtons(QWidget* back, QWidget* main, First first = First::Main);
+    void addButton(QWidget* only, Qt::Alignment side = Qt::AlignTrailing);
+    void whenEscaped(std::function<void()> handler);
     // Of a 1024 by 768 window.
     void setCardWidth(double width);
     // The card takes all the room that the margins leave.

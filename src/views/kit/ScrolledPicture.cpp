@@ -1,7 +1,8 @@
 #include "views/kit/ScrolledPicture.h"
 
+#include "views/kit/Painting.h"
+
 #include <QMouseEvent>
-#include <QPainter>
 #include <QScrollBar>
 
 namespace lumora {
@@ -58,9 +59,8 @@ void ScrolledPicture::paintEvent(QPaintEvent*) {
 
 void ScrolledPicture::paintPicture(QPainter& painter) const {
     if (m_picture.isNull()) {
-        const int size = m_theme.px(64);
-        painter.drawPixmap((viewport()->width() - size) / 2, (viewport()->height() - size) / 2,
-                           m_theme.icon(u"document"_s, size, Theme::Colour::Edge));
+        drawIcon(painter, QRectF(viewport()->rect()).center(),
+                 m_theme.icon(u"document"_s, m_theme.px(64), Theme::Colour::Edge));
         return;
     }
     const double scale = m_theme.factor();

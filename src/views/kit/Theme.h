@@ -3,6 +3,7 @@
 #include <QColor>
 #include <QFont>
 #include <QIcon>
+#include <QMargins>
 #include <QPixmap>
 #include <QString>
 
@@ -12,6 +13,13 @@
 class QApplication;
 
 namespace lumora {
+
+// The room between neighbours.
+enum class Space { None, Tight, Small, Normal, Wide, Far };
+// The room between the edge of a card and what it holds.
+enum class Pad { Tight, Slim, Normal, Wide };
+// The side of an icon: of a small key, of a button, at a line of words, of a box, of an empty page.
+enum class Sign { Small, Button, Line, Box, Page };
 
 // The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
 class Theme {
@@ -51,11 +59,14 @@ public:
     double factor() const { return m_factor; }
     int px(double length) const;
 
-    // Spacing.
-    int gap() const { return px(12); }
-    int wideGap() const { return px(24); }
-    int margin() const { return px(28); }
+    int size(Space space) const;
+    int size(Sign sign) const;
+    QMargins margins(Pad pad) const;
+    int gap() const { return size(Space::Normal); }
+    int margin() const { return size(Space::Far); } // of a page
     int corner() const { return px(14); }
+    int hair() const { return px(2); }  // a line that is to be noticed
+    int thick() const { return px(3); } // a line around what is chosen
     // No control that can be pressed is smaller than this, on any window.
     int target() const { return px(48) < 44 ? 44 : px(48); }
     // Plus and minus of a small picture: as small as a target may be.

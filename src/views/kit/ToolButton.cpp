@@ -1,8 +1,7 @@
 #include "views/kit/ToolButton.h"
 
-#include "views/kit/PageFrame.h"
-
-#include <QPainter>
+#include "views/kit/Maker.h"
+#include "views/kit/Painting.h"
 
 #include <algorithm>
 
@@ -47,7 +46,8 @@ QFont ToolButton::words() const {
 // One line where it fits, else two, broken at the blank that leaves the longer one shortest.
 QStringList ToolButton::lines() const {
     QString said = text();
-    said.replace(u"&&"_s, u"&"_s).remove(QChar(0x2066)).remove(QChar(0x2069));
+    said.replace(u"&&"_s, u"&"_s);
+    said = withoutIsolation(said);
     const QFontMetrics metrics(words());
     const int room = m_theme.px(m_size.width()) - m_theme.px(6);
     if (metrics.horizontalAdvance(said) <= room || !said.contains(u' '))
@@ -79,15 +79,12 @@ QSize ToolButton::minimumSizeHint() const {
 
 void ToolButton::paintEvent(QPaintEvent*) {
     QPainter painter(this);
-    painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
     const bool lively = isEnabled() && (underMouse() || isDown());
-    const double thick = m_marked || isDown() ? m_theme.px(2) : 1;
-    const QRectF card = QRectF(rect()).adjusted(thick / 2, thick / 2, -thick / 2, -thick / 2);
-    painter.setPen(QPen(m_marked || lively ? Theme::Colour::Primary : Theme::Colour::Line, thick));
-    painter.setBrush(!isEnabled()           ? Theme::Colour::Sunken
-                     : isDown() || m_marked ? Theme::Colour::PrimarySoft
-                                            : Theme::Colour::Surface);
-    painter.drawRoundedRect(card, m_theme.px(11), m_theme.px(11));
+    drawCard(painter, rect(), m_marked || lively ? Theme::Colour::Primary : Theme::Colour::Line,
+             !isEnabled()           ? Theme::Colour::Sunken
+             : isDown() || m_marked ? Theme::Colour::PrimarySoft
+                                    : Theme::Colour::Surface,
+             m_marked || isDown() ? m_theme.hair() : 1, m_theme.px(11));
     if (isDown()) // sunk
         painter.translate(0, m_theme.px(1));
 
@@ -99,14 +96,10 @@ void ToolButton::paintEvent(QPaintEvent*) {
     const double gap = m_theme.px(2);
     const double top = (height() - signHeight - gap - under) / 2;
     if (m_picture.isNull()) {
-        const int sign = static_cast<int>(signHeight);
-        painter.drawPixmap(QPointF((width() - sign) / 2.0, top),
-                           m_theme.icon(m_icon, sign, isEnabled() ? m_ink : Theme::Colour::Muted));
+        drawIcon(painter, {width() / 2.0, top + signHeight / 2},
+                 m_theme.icon(m_icon, static_cast<int>(signHeight), isEnabled() ? m_ink : Theme::Colour::Muted));
     } else {
-        QRectF box(QPointF(),
-                   QSizeF(m_picture.size()).scaled(width() - m_theme.px(12), signHeight, Qt::KeepAspectRatio));
-        box.moveCenter({width() / 2.0, top + signHeight / 2});
-        painter.drawImage(box, m_picture);
+        drawImage(painter, QRectF(m_theme.px(6), top, width() - m_theme.px(12), signHeight), m_picture);
     }
     painter.setFont(words());
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);

@@ -1,6 +1,6 @@
 #include "views/kyoskNew/PictureCell.h"
 
-#include "views/kit/PageFrame.h"
+#include "views/kit/Maker.h"
 
 #include <QHBoxLayout>
 #include <QKeyEvent>
@@ -14,7 +14,7 @@ using namespace Qt::StringLiterals;
 
 PictureCell::PictureCell(const Theme& theme, QWidget* parent)
     : CardButton(theme, parent) {
-    setCardSize(146, 160);
+    setCardSize({146, 160});
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     m_strip = new QWidget(this);
     // Minus stands left of plus in both languages, as on every counter.

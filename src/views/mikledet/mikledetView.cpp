@@ -21,14 +21,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-QString numbered(const char* name, int index) {
-    return u"%1(%2)"_s.arg(QLatin1StringView(name)).arg(index);
-}
-
-} // namespace
-
 mikledetView::mikledetView(mikledet& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
     , m_page(page) {

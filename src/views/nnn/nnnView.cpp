@@ -7,13 +7,8 @@
 
 #include <QCheckBox>
 #include <QComboBox>
-#include <QGridLayout>
-#include <QHBoxLayout>
-#include <QLabel>
 #include <QLineEdit>
-#include <QPushButton>
 #include <QStackedLayout>
-#include <QVBoxLayout>
 
 #include <algorithm>
 
@@ -22,8 +17,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
-    : PageView(page, state, theme)
-    , m_page(page) {
+    : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Details);
     auto* content = new QWidget(this);
     m_steps = new QStackedLayout(content);
@@ -51,10 +45,8 @@ nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
 nnnView::~nnnView() = default;
 
 QWidget* nnnView::makeMenu() {
-    auto* menu = new QWidget(this);
-    m_tileGrid = new QGridLayout(menu);
-    m_tileGrid->setContentsMargins(0, 0, 0, 0);
-    m_tileGrid->setSpacing(theme().px(18));
+    m_tileGrid = inGrid(Space::Wide);
+    QWidget* menu = inBox(m_tileGrid);
     static constexpr std::array<const char*, 10> icons = {"printer", "bolt", "layers", "arrow-left", "mail",
                                                           "exit",    "book", "resend", "globe",      "info"};
     for (int i = 0; i < 10; ++i) {
@@ -62,7 +54,7 @@ QWidget* nnnView::makeMenu() {
             continue; // leaving and the language stand in the header
         auto* tile = new Tile(theme(), this, QString::fromLatin1(icons[static_cast<std::size_t>(i)]));
         connect(tile, &QAbstractButton::clicked, this, [this, i] { m_page.Image1_Click(i); });
-        bind(u"Image1(%1)"_s.arg(i), tile, m_page.Image1[static_cast<std::size_t>(i)]);
+        bind(numbered("Image1", static_cast<std::size_t>(i)), tile, m_page.Image1[static_cast<std::size_t>(i)]);
         m_tiles[static_cast<std::size_t>(i)] = tile;
     }
     return menu;
@@ -87,226 +79,161 @@ void nnnView::placeTiles() {
 }
 
 QWidget* nnnView::makeDetails() {
-    auto* step = new QWidget(this);
-    auto* outer = new QHBoxLayout(step);
-    outer->setContentsMargins(0, 0, 0, 0);
-    outer->addStretch(1);
-    auto* card = new QFrame(step);
-    setRole(card, "card");
-    card->setMinimumWidth(theme().px(720));
-    auto* form = new QVBoxLayout(card);
-    form->setContentsMargins(theme().px(32), theme().px(24), theme().px(32), theme().px(24));
-    form->setSpacing(theme().px(6));
+    const Card form = makeCard("card", Pad::Wide, Space::Tight);
+    form.frame->setMinimumWidth(theme().px(720));
     const auto line = [&](const QString& name, const Caption& caption, const QString& labelName,
                           const Caption& labelCaption, void (nnn::*changed)(const QString&)) {
-        auto* title = label(labelName, labelCaption, "strong");
-        form->addWidget(title);
-        auto* box = field(name, caption, [&page = m_page, changed](const QString& text) { (page.*changed)(text); });
+        QLabel* title = label(labelName, labelCaption, "strong");
+        QLineEdit* box = field(name, caption, toPage(changed));
         box->setMaxLength(200);
         title->setBuddy(box);
-        form->addWidget(box);
-        form->addSpacing(theme().px(10));
+        add(*form.column, {title, box, Space::Small});
         return box;
     };
     m_name = line(u"Text2"_s, m_page.Text2, u"LabelText2"_s, m_page.LabelText2, &nnn::Text2_Change);
     m_telephone = line(u"Text3"_s, m_page.Text3, u"LabelText3"_s, m_page.LabelText3, &nnn::Text3_Change);
     m_telephone->setInputMethodHints(Qt::ImhDialableCharactersOnly);
     m_address = line(u"Text4"_s, m_page.Text4, u"LabelText4"_s, m_page.LabelText4, &nnn::Text4_Change);
-    auto* row = new QHBoxLayout;
-    row->addWidget(checkBox(u"Check2"_s, m_page.Check2, [this](bool on) { m_page.Check2_Click(on); }));
-    row->addStretch(1);
-    row->addWidget(button(
-        u"Command10"_s, m_page.Command10, Role::Plain, [this] { m_page.Command10_Click(); }, u"memory"_s));
-    form->addLayout(row);
-    auto* centred = new QVBoxLayout;
-    centred->addWidget(card);
-    centred->addStretch(1);
-    outer->addLayout(centred, 4);
-    outer->addStretch(1);
-    return step;
+    form.column->addLayout(inRow(
+        Space::Normal, {checkBox(u"Check2"_s, m_page.Check2, toPage(&nnn::Check2_Click)), Item::room(),
+                        button(u"Command10"_s, m_page.Command10, Role::Plain, &nnn::Command10_Click, u"memory"_s)}));
+    return inMiddle(inBox(inColumn(Space::None, {form.frame, Item::room()})), 4);
 }
 
 QWidget* nnnView::makeOptions() {
-    auto* step = new QWidget(this);
-    auto* column = new QVBoxLayout(step);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(10));
-    column->addWidget(label(u"LabelSizes"_s, m_page.LabelSizes, "large"));
-    auto* sizes = new QHBoxLayout;
-    sizes->setSpacing(theme().px(16));
+    auto* sizes = inRow(Space::Wide);
     for (std::size_t i = 0; i < m_page.Option1.size(); ++i) {
-        auto* card = new PaperCard(theme(), this);
-        card->setCardSize(190, 200);
-        bindChoice(u"Option1(%1)"_s.arg(i), card, m_page.Option1[i],
+        const auto paper = [](QPainter& painter, const QRectF& place, const QString& size) {
+            drawPaperSample(painter, place, size);
+        };
+        auto* card = new DrawingCard(theme(), this, paper, {190, 200}, DrawingCard::Words::Size);
+        bindChoice(numbered("Option1", i), card, m_page.Option1[i],
                    [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
         sizes->addWidget(card, 2);
     }
-    auto* more = new QVBoxLayout;
-    more->addStretch(1);
-    m_moreSizes =
-        comboBox(u"Combo1"_s, m_page.Combo1List, m_page.Combo1, [this](int row) { m_page.Combo1_Click(row); });
+    m_moreSizes = comboBox(u"Combo1"_s, m_page.Combo1List, m_page.Combo1, toPage(&nnn::Combo1_Click));
     m_moreSizes->setMinimumWidth(theme().px(220));
-    more->addWidget(m_moreSizes);
-    m_coupon = label(u"Label4kpn"_s, m_page.Label4kpn, "muted");
-    more->addWidget(m_coupon);
-    more->addStretch(1);
-    sizes->addLayout(more, 2);
-    column->addLayout(sizes, 3);
-    column->addSpacing(theme().px(6));
-    column->addWidget(label(u"LabelKinds"_s, m_page.LabelKinds, "large"));
-    auto* kinds = new QHBoxLayout;
-    kinds->setSpacing(theme().px(16));
+    sizes->addLayout(inColumn(Space::Normal, {Item::room(), m_moreSizes,
+                                              label(u"Label4kpn"_s, m_page.Label4kpn, "muted"), Item::room()}),
+                     2);
+    auto* kinds = inRow(Space::Wide);
     for (std::size_t i = 0; i < m_page.Option3.size(); ++i) {
-        auto* card =
-            new DrawingCard(theme(), this, i == 0 ? DrawingCard::Drawing::Matte : DrawingCard::Drawing::Glossy);
-        card->setCardSize(260, 165);
-        bindChoice(u"Option3(%1)"_s.arg(i), card, m_page.Option3[i],
+        auto* card = new DrawingCard(theme(), this,
+                                     [finish = i == 0 ? PaperFinish::Matte : PaperFinish::Glossy](
+                                         QPainter& painter, const QRectF& place, const QString&) {
+                                         const QRectF paper = fitted(place, {3, 2});
+                                         drawSamplePrint(painter, paper, finish);
+                                         drawThinLine(painter, paper);
+                                     },
+                                     {260, 165});
+        bindChoice(numbered("Option3", i), card, m_page.Option3[i],
                    [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
         kinds->addWidget(card, 2);
     }
     kinds->addStretch(2);
-    column->addLayout(kinds, 2);
+    QWidget* step = inBox(inColumn(Space::Small, {label(u"LabelSizes"_s, m_page.LabelSizes, "large"),
+                                                  {sizes, 3},
+                                                  Space::Tight,
+                                                  label(u"LabelKinds"_s, m_page.LabelKinds, "large"),
+                                                  {kinds, 2}}));
     bind(u"Frame4"_s, new QWidget(step), m_page.Frame4);
     return step;
 }
 
 QWidget* nnnView::makeBorders() {
-    auto* step = new QWidget(this);
-    auto* row = new QHBoxLayout(step);
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(theme().px(24));
-    auto* grid = new QGridLayout;
-    grid->setSpacing(theme().px(12));
+    auto* grid = inGrid(Space::Normal);
     for (int i = 0; i < 10; ++i) {
         const auto at = static_cast<std::size_t>(i);
-        auto* card = new BorderCard(theme(), this, borderCode(i));
-        bindChoice(u"Image13(%1)"_s.arg(i), card, m_page.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
+        auto* card = new DrawingCard(
+            theme(), this,
+            [code = borderCode(i)](QPainter& painter, const QRectF& place, const QString&) {
+                drawBorderSample(painter, place, code);
+            },
+            {150, 140}, DrawingCard::Words::Small);
+        bindChoice(numbered("Image13", at), card, m_page.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
         grid->addWidget(card, i / 4, i % 4);
     }
-    row->addLayout(grid, 3);
-    auto* preview = new QFrame(step);
-    setRole(preview, "card");
-    auto* previewColumn = new QVBoxLayout(preview);
-    previewColumn->setContentsMargins(theme().px(16), theme().px(16), theme().px(16), theme().px(16));
-    m_sample = new BorderSample(preview);
+    const Card preview = makeCard("card", Pad::Normal);
+    m_sample = new BorderSample(preview.frame);
     m_sample->setMinimumSize(theme().px(240), theme().px(200));
     bind(u"Picture16"_s, m_sample, [this] { return QString::number(m_page.Picture16); });
-    previewColumn->addWidget(m_sample, 1);
-    m_sampleName = makeLabel(preview, "strong");
+    m_sampleName = words("strong");
     m_sampleName->setAlignment(Qt::AlignCenter);
-    previewColumn->addWidget(m_sampleName);
-    row->addWidget(preview, 1);
+    add(*preview.column, {{m_sample, 1}, m_sampleName});
+    QWidget* step = inBox(inRow(Space::Far, {{grid, 3}, {preview.frame, 1}}));
     bind(u"Picture4"_s, new QWidget(step), m_page.Picture4);
     return step;
 }
 
 QWidget* nnnView::makeFit() {
-    auto* step = new QWidget(this);
-    auto* row = new QHBoxLayout(step);
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(theme().px(24));
-    row->addStretch(1);
-    auto* fit = new DrawingCard(theme(), this, DrawingCard::Drawing::Fit);
-    fit->setCardSize(320, 300);
-    bindChoice(u"Option4"_s, fit, m_page.Option4, [this] { m_page.Option4_Click(); });
-    auto* fill = new DrawingCard(theme(), this, DrawingCard::Drawing::Fill);
-    fill->setCardSize(320, 300);
-    bindChoice(u"Option5"_s, fill, m_page.Option5, [this] { m_page.Option5_Click(); });
-    row->addWidget(fit, 2, Qt::AlignVCenter);
-    row->addWidget(fill, 2, Qt::AlignVCenter);
-    row->addStretch(1);
+    // Whole on the paper, or over all of it.
+    const auto card = [&](const QString& name, const CheckCaption& caption, QSizeF shape, void (nnn::*clicked)()) {
+        auto* made = new DrawingCard(theme(), this,
+                                     [shape](QPainter& painter, const QRectF& place, const QString&) {
+                                         const QRectF paper = fitted(place, {3, 2});
+                                         painter.fillRect(paper, Qt::white);
+                                         drawSamplePicture(painter, fitted(paper, shape));
+                                         drawThinLine(painter, paper);
+                                     },
+                                     {320, 300});
+        bindChoice(name, made, caption, toPage(clicked));
+        return made;
+    };
+    QWidget* step =
+        inBox(inRow(Space::Far, {Item::room(),
+                                 {card(u"Option4"_s, m_page.Option4, {4, 3}, &nnn::Option4_Click), 2, Qt::AlignVCenter},
+                                 {card(u"Option5"_s, m_page.Option5, {3, 2}, &nnn::Option5_Click), 2, Qt::AlignVCenter},
+                                 Item::room()}));
     bind(u"Picture5"_s, new QWidget(step), m_page.Picture5);
     return step;
 }
 
 QWidget* nnnView::makeTerms() {
-    auto* step = new QWidget(this);
-    auto* outer = new QHBoxLayout(step);
-    outer->setContentsMargins(0, 0, 0, 0);
-    outer->addStretch(1);
-    auto* column = new QVBoxLayout;
-    column->setSpacing(theme().px(16));
-    auto* summary = new QFrame(step);
-    setRole(summary, "card");
-    auto* summaryColumn = new QVBoxLayout(summary);
-    summaryColumn->setContentsMargins(theme().px(32), theme().px(22), theme().px(32), theme().px(22));
-    m_chosenHead = makeLabel(summary, "muted");
-    summaryColumn->addWidget(m_chosenHead);
-    m_chosen = makeLabel(summary, "large");
-    summaryColumn->addWidget(m_chosen);
-    column->addWidget(summary);
-    auto* terms = new QFrame(step);
-    setRole(terms, "card");
-    terms->setMinimumWidth(theme().px(640));
-    auto* termsColumn = new QVBoxLayout(terms);
-    termsColumn->setContentsMargins(theme().px(32), theme().px(22), theme().px(32), theme().px(22));
-    termsColumn->setSpacing(theme().px(10));
-    m_termsHead = makeLabel(terms, "muted");
-    termsColumn->addWidget(m_termsHead);
-    auto* row = new QHBoxLayout;
-    row->addWidget(checkBox(u"Check1"_s, m_page.Check1, [this](bool on) { m_page.Check1_Click(on); }));
-    row->addStretch(1);
-    row->addWidget(button(
-        u"Command29"_s, m_page.Command29, Role::Plain, [this] { m_page.Command29_Click(); }, u"document"_s));
-    termsColumn->addLayout(row);
-    m_hint = new QFrame(terms);
-    setRole(m_hint, "notice");
-    auto* hintRow = new QHBoxLayout(m_hint);
-    hintRow->setContentsMargins(theme().px(16), theme().px(10), theme().px(16), theme().px(10));
-    hintRow->addWidget(label(u"LabelTerms"_s, m_page.LabelTerms), 1);
-    hintRow->addWidget(button(
-        u"Command30"_s, m_page.Command30, Role::Quiet, [this] { m_page.Command30_Click(); }, u"close"_s));
-    termsColumn->addWidget(m_hint);
-    column->addWidget(terms);
-    column->addStretch(1);
-    outer->addLayout(column, 4);
-    outer->addStretch(1);
-    return step;
+    const Card summary = makeCard("card", Pad::Wide);
+    m_chosenHead = words("muted");
+    m_chosen = words("large");
+    add(*summary.column, {m_chosenHead, m_chosen});
+    const Card terms = makeCard("card", Pad::Wide);
+    terms.frame->setMinimumWidth(theme().px(640));
+    m_termsHead = words("muted");
+    QLayout* row = inRow(Space::Normal,
+                         {checkBox(u"Check1"_s, m_page.Check1, toPage(&nnn::Check1_Click)), Item::room(),
+                          button(u"Command29"_s, m_page.Command29, Role::Plain, &nnn::Command29_Click, u"document"_s)});
+    const Card hint = makeCard("notice", Pad::Slim);
+    m_hint = hint.frame;
+    hint.column->addLayout(inRow(
+        Space::Normal, {{label(u"LabelTerms"_s, m_page.LabelTerms), 1},
+                        button(u"Command30"_s, m_page.Command30, Role::Quiet, &nnn::Command30_Click, u"close"_s)}));
+    add(*terms.column, {m_termsHead, row, m_hint});
+    return inMiddle(inBox(inColumn(Space::Wide, {summary.frame, terms.frame, Item::room()})), 4);
 }
 
 void nnnView::makeBars() {
-    frame().addHeaderAction(button(
-        u"Image1(8)"_s, m_page.Image1[EnglishTile], Role::Quiet, [this] { m_page.Image1_Click(EnglishTile); },
-        u"globe"_s));
-    frame().addHeaderAction(button(
-        u"Image1(5)"_s, m_page.Image1[ExitTile], Role::Quiet, [this] { m_page.Image1_Click(ExitTile); }, u"exit"_s));
-
-    m_back = button(u"Command4"_s, m_page.Command4, Role::Secondary, [this] { m_page.Command4_Click(); });
-    frame().addSecondaryAction(m_back);
-    frame().addSecondaryAction(
-        button(u"Command2"_s, m_page.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }));
-    frame().addSecondaryAction(button(
-        u"Command15"_s, m_page.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"info"_s));
-    frame().addSecondaryAction(button(
-        u"Command14"_s, m_page.Command14, Role::Secondary, [this] { m_page.Command14_Click(); }, u"eraser"_s));
+    frame().addHeaderActions(
+        {button(u"Image1(8)"_s, m_page.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
+         button(u"Image1(5)"_s, m_page.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
+    m_back = button(u"Command4"_s, m_page.Command4, Role::Secondary, &nnn::Command4_Click);
+    frame().addSecondaryActions(
+        {m_back, button(u"Command2"_s, m_page.Command2, Role::Quiet, &nnn::Command2_Click),
+         button(u"Command15"_s, m_page.Command15, Role::Secondary, &nnn::Command15_Click, u"info"_s),
+         button(u"Command14"_s, m_page.Command14, Role::Secondary, &nnn::Command14_Click, u"eraser"_s)});
     m_choiceStatus = label(u"Choice"_s, m_page.Choice, "strong");
-    m_choiceStatus->setWordWrap(false);
-    frame().addStatus(m_choiceStatus);
-    auto* phone = new QLabel(this);
-    phone->setPixmap(theme().icon(u"phone"_s, theme().px(22), Theme::Colour::Primary));
-    frame().addStatus(phone);
-    auto* telephone = label(u"Label4Tel"_s, m_page.Label4Tel, "muted");
-    telephone->setWordWrap(false);
-    frame().addStatus(telephone);
-
-    m_toOptions = button(u"Command12"_s, m_page.Command12, Role::Main, [this] { m_page.Command12_Click(); });
-    m_toBorders = button(u"Command8"_s, m_page.Command8, Role::Main, [this] { m_page.Command8_Click(); });
-    m_fromBorder = button(u"Command6"_s, m_page.Command6, Role::Main, [this] { m_page.Command6_Click(); });
-    m_finish = button(u"Command3"_s, m_page.Command3, Role::Main, [this] { m_page.Command3_Click(); });
-    for (QPushButton* main : QList{m_toOptions, m_toBorders, m_fromBorder, m_finish} + m_album->mainButtons())
+    QLabel* telephone = label(u"Label4Tel"_s, m_page.Label4Tel, "muted");
+    for (QLabel* line : {m_choiceStatus, telephone})
+        line->setWordWrap(false);
+    frame().addStatus({m_choiceStatus, sign(u"phone"_s, Sign::Small), telephone});
+    frame().addMainActions({button(u"Command12"_s, m_page.Command12, Role::Main, &nnn::Command12_Click),
+                            button(u"Command8"_s, m_page.Command8, Role::Main, &nnn::Command8_Click),
+                            button(u"Command6"_s, m_page.Command6, Role::Main, &nnn::Command6_Click),
+                            button(u"Command3"_s, m_page.Command3, Role::Main, &nnn::Command3_Click)});
+    for (QPushButton* main : m_album->mainButtons())
         frame().addMainAction(main);
 
     m_clean = new Overlay(theme(), this);
     m_clean->column()->addWidget(label(u"Frame1"_s, m_page.Frame1, "large"));
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme().gap());
-    auto* keep = button(u"Command9"_s, m_page.Command9, Role::Secondary, [this] { m_page.Command9_Click(); });
-    row->addWidget(keep);
-    row->addStretch(1);
-    row->addWidget(button(u"Command7"_s, m_page.Command7, Role::Main, [this] { m_page.Command7_Click(); }));
-    m_clean->column()->addLayout(row);
-    m_clean->setFirstFocus(keep);
-    connect(m_clean, &Overlay::escaped, this, [this] { m_page.Command9_Click(); });
+    m_clean->addButtons(button(u"Command9"_s, m_page.Command9, Role::Secondary, &nnn::Command9_Click),
+                        button(u"Command7"_s, m_page.Command7, Role::Main, &nnn::Command7_Click), Overlay::First::Back);
+    m_clean->whenEscaped(toPage(&nnn::Command9_Click));
 }
 
 QWidget* nnnView::firstFocus() const {

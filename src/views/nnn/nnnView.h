@@ -6,8 +6,6 @@
 #include <array>
 #include <memory>
 
-class QFrame;
-class QGridLayout;
 class QStackedLayout;
 
 namespace lumora {
@@ -15,7 +13,7 @@ namespace lumora {
 class BorderSample;
 class Tile;
 
-class nnnView : public PageView {
+class nnnView : public ViewOf<nnn> {
     Q_OBJECT
 public:
     nnnView(nnn& page, const SessionState& state, const Theme& theme);
@@ -38,7 +36,6 @@ private:
     void makeBars();
     void placeTiles();
 
-    nnn& m_page;
     std::unique_ptr<Album> m_album;
     QStackedLayout* m_steps;
     std::array<Tile*, 10> m_tiles{};
@@ -47,10 +44,6 @@ private:
     QLineEdit* m_name = nullptr;
     QLineEdit* m_telephone = nullptr;
     QLineEdit* m_address = nullptr;
-    QPushButton* m_toOptions = nullptr;
-    QPushButton* m_toBorders = nullptr;
-    QPushButton* m_fromBorder = nullptr;
-    QPushButton* m_finish = nullptr;
     QPushButton* m_back = nullptr;
     QComboBox* m_moreSizes = nullptr;
     BorderSample* m_sample = nullptr;
@@ -60,7 +53,6 @@ private:
     QLabel* m_chosen = nullptr;
     QLabel* m_chosenHead = nullptr;
     QLabel* m_choiceStatus = nullptr;
-    QLabel* m_coupon = nullptr;
     Overlay* m_clean = nullptr;
     nnn::Step m_shownStep = nnn::Step::Menu;
     int m_focusRequest = 0;

@@ -7,12 +7,13 @@ class QStackedLayout;
 
 namespace lumora {
 
-class AlbumCard;
+enum class AlbumDrawing;
 class ChoiceCards;
+class DrawingCard;
 class EditableCombo;
 
 // The panels of a parent album within the view of the details page.
-class nnnView::Album {
+class nnnView::Album : private Maker {
 public:
     explicit Album(nnnView& view);
 
@@ -27,12 +28,15 @@ private:
     QWidget* makePhotographer();
     QWidget* makeKinds();
     QWidget* makeParents();
-    // highest: of a 1024 by 768 window.
-    QWidget* makeChoice(ChoiceCards* cards, int share, int highest);
     QWidget* makeExtras();
     QWidget* makeBill();
     ChoiceCards* cards(const QString& name, const AlbumPanels::Choice& choice, int columns,
-                       std::initializer_list<int> drawings, QSize size, void (AlbumPanels::*taken)(int));
+                       const QList<AlbumDrawing>& drawings, QSize size, void (AlbumPanels::*taken)(int));
+    QCheckBox* checkBox(const QString& name, const CheckCaption& caption, void (AlbumPanels::*clicked)(bool));
+    template <class... Values>
+    auto toAlbum(void (AlbumPanels::*handler)(Values...)) const {
+        return [&album = m_album, handler](Values... values) { (album.*handler)(values...); };
+    }
     void addNext(const QString& name, const Caption& caption, void (AlbumPanels::*pressed)());
 
     nnnView& m_view;
@@ -42,7 +46,7 @@ private:
     QStackedLayout* m_panels;
     std::array<QLineEdit*, 4> m_boxes{};
     EditableCombo* m_domain = nullptr;
-    std::array<AlbumCard*, 6> m_kinds{};
+    std::array<DrawingCard*, 6> m_kinds{};
     QWidget* m_parents = nullptr;
     QWidget* m_copies = nullptr;
     QComboBox* m_parentSize = nullptr;

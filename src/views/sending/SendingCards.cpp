@@ -1,7 +1,7 @@
 #include "views/sending/SendingCards.h"
 
 #include "views/kit/Gauge.h"
-#include "views/kit/PageFrame.h"
+#include "views/kit/Maker.h"
 
 #include <QFrame>
 #include <QHBoxLayout>

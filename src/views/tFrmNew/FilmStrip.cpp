@@ -8,7 +8,7 @@ using namespace Qt::StringLiterals;
 
 StripCell::StripCell(const Theme& theme, QWidget* parent)
     : CardButton(theme, parent) {
-    setCardSize(64, 62);
+    setCardSize({64, 62});
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
 }
 

@@ -1,6 +1,6 @@
 #include "views/window/MessagePanel.h"
 
-#include "views/kit/PageFrame.h"
+#include "views/kit/Maker.h"
 
 #include <QHBoxLayout>
 #include <QLabel>

@@ -66,7 +66,8 @@ void fillList(QListWidget& widget, const TextList& list, const std::function<QSt
 } // namespace
 
 PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
-    : m_page(page)
+    : Maker(theme, this)
+    , m_page(page)
     , m_state(state)
     , m_theme(theme) {
     setObjectName(pageName(page.id()));
@@ -135,7 +136,7 @@ void PageView::renderBindings() {
             else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
                 fillCombo(*box, *control.list, *control.caption);
             else if (auto* cards = qobject_cast<ChoiceCards*>(widget))
-                cards->display(*control.list);
+                cards->display(control.list->items(), control.list->currentIndex());
         }
         if (!control.caption)
             continue;
@@ -299,9 +300,7 @@ void PageView::setDirectedIcon(QPushButton* button, Way way) {
 }
 
 void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colour) {
-    const int size = m_theme.px(24);
-    button->setIcon(m_theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
-    button->setIconSize({size, size});
+    setButtonIcon(button, m_theme, icon, colour);
 }
 
 void PageView::speak(QWidget* widget, const QString& text) const {

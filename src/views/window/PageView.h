@@ -4,8 +4,8 @@
 #include "session/Page.h"
 #include "session/SessionState.h"
 #include "session/TextList.h"
-#include "views/kit/PageFrame.h"
 #include "views/kit/Theme.h"
+#include "views/window/PageFrame.h"
 
 #include <QElapsedTimer>
 #include <QPointer>
@@ -30,7 +30,7 @@ class Overlay;
 // The base of all views. A control is bound to the page's state under its design name: text, visible, enabled and hint
 // follow the Caption at each rendering, and what the customer does calls the page's handler. render() sets what is more
 // than that.
-class PageView : public QWidget {
+class PageView : public QWidget, protected Maker {
     Q_OBJECT
 public:
     PageView(Page& page, const SessionState& state, const Theme& theme);
@@ -123,5 +123,41 @@ private:
     bool m_dirty = true;
     bool m_detached = false;
 };
+
+// The base of the view of one page.
+template <class P>
+class ViewOf : public PageView {
+protected:
+    ViewOf(P& page, const SessionState& state, const Theme& theme)
+        : PageView(page, state, theme)
+        , m_page(page) {}
+
+    // A button that calls the page's handler, for one of an array with its index.
+    using PageView::button;
+    QPushButton* button(const QString& name, const Caption& caption, Role role, void (P::*clicked)(),
+                        const QString& icon = {}) {
+        return button(
+            name, caption, role, [&page = m_page, clicked] { (page.*clicked)(); }, icon);
+    }
+    QPushButton* button(const QString& name, const Caption& caption, Role role, void (P::*clicked)(int), int index,
+                        const QString& icon = {}) {
+        return button(
+            name, caption, role, [&page = m_page, clicked, index] { (page.*clicked)(index); }, icon);
+    }
+    auto toPage(void (P::*handler)()) const {
+        return [&page = m_page, handler] { (page.*handler)(); };
+    }
+    template <class Value>
+    auto toPage(void (P::*handler)(Value)) const {
+        return [&page = m_page, handler](Value value) { (page.*handler)(value); };
+    }
+
+    P& m_page;
+};
+
+// The control of an array: "Command4Snif(3)".
+inline QString numbered(const char* name, std::size_t index) {
+    return QStringLiteral("%1(%2)").arg(QLatin1StringView(name)).arg(index);
+}
 
 } // namespace lumora

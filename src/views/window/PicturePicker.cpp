@@ -5,7 +5,7 @@
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
-#include "views/kit/PageFrame.h"
+#include "views/kit/Maker.h"
 
 #include <QHBoxLayout>
 #include <QKeyEvent>
@@ -153,7 +153,7 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     column()->addWidget(guide);
 
     auto* middle = new QHBoxLayout;
-    middle->setSpacing(theme.wideGap());
+    middle->setSpacing(theme.margin());
     auto* side = new QVBoxLayout;
     side->setSpacing(theme.px(8));
     auto* sideTitle = makeLabel(this, "smallMuted");

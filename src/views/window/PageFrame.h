@@ -1,21 +1,15 @@
 #pragma once
 
-#include "views/kit/StepBar.h"
-#include "views/kit/Theme.h"
+#include "views/kit/Maker.h"
+#include "views/window/StepBar.h"
 
 #include <QWidget>
-
-class QBoxLayout;
-class QHBoxLayout;
-class QLabel;
-class QPushButton;
-class QVBoxLayout;
 
 namespace lumora {
 
 // What all pages share: the header with the step bar, the title, the content, and the bottom bar, where the main
 // action stands at the far end of the reading direction and the way back at its beginning.
-class PageFrame : public QWidget {
+class PageFrame : public QWidget, private Maker {
     Q_OBJECT
 public:
     PageFrame(const Theme& theme, QWidget* parent);
@@ -30,14 +24,17 @@ public:
 
     QVBoxLayout* content() const { return m_content; }
     // Leaving, the language: at the far end of the header.
-    void addHeaderAction(QWidget* widget);
-    void addMainAction(QWidget* widget);
-    void addSecondaryAction(QWidget* widget);
+    void addHeaderActions(std::initializer_list<Item> items);
+    void addMainActions(std::initializer_list<Item> items);
+    void addSecondaryActions(std::initializer_list<Item> items);
+    void addMainAction(QWidget* widget) { addMainActions({widget}); }
+    void addSecondaryAction(QWidget* widget) { addSecondaryActions({widget}); }
+    void addHeaderAction(QWidget* widget) { addHeaderActions({widget}); }
     // In the middle of the bottom bar: counts, totals.
-    void addStatus(QWidget* widget);
+    void addStatus(std::initializer_list<Item> items);
+    void addStatus(QWidget* widget) { addStatus({Item(widget)}); }
 
 private:
-    const Theme& m_theme;
     StepBar* m_steps;
     QLabel* m_title;
     QLabel* m_subtitle;
@@ -50,11 +47,5 @@ private:
     QHBoxLayout* m_secondary;
     QHBoxLayout* m_status;
 };
-
-// Labels take their look from the theme by this.
-QLabel* makeLabel(QWidget* parent, const char* type);
-void setRole(QWidget* widget, const char* role);
-// The same for a widget that may have been shown, which takes its new look at once.
-void changeRole(QWidget* widget, const char* role);
 
 } // namespace lumora

@@ -1,13 +1,15 @@
-#include "views/kit/StepBar.h"
+#include "views/window/StepBar.h"
 
-#include <QPainter>
+#include "views/kit/Painting.h"
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 StepBar::StepBar(const Theme& theme, QWidget* parent)
     : QWidget(parent)
     , m_theme(theme) {
-    setObjectName(QStringLiteral("stepBar"));
+    setObjectName(u"stepBar"_s);
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
 }
 
@@ -73,9 +75,7 @@ void StepBar::paintEvent(QPaintEvent*) {
         painter.setBrush(done || here ? Theme::Colour::Primary : Theme::Colour::Surface);
         painter.drawEllipse(at, radius, radius);
         if (done) {
-            const int size = m_theme.px(18);
-            painter.drawPixmap(QPointF(at.x() - size / 2.0, at.y() - size / 2.0),
-                               m_theme.icon(QStringLiteral("tick"), size, Qt::white));
+            drawIcon(painter, at, m_theme.icon(u"tick"_s, m_theme.px(18), Qt::white));
         } else {
             painter.setFont(m_theme.font(Theme::Type::Small));
             painter.setPen(here ? QColor(Qt::white) : Theme::Colour::Muted);

@@ -1,0 +1,118 @@
+#include "views/kit/Maker.h"
+
+#include <QVariant>
+
+namespace lumora {
+
+QLabel* makeLabel(QWidget* parent, const char* type) {
+    auto* label = new QLabel(parent);
+    label->setProperty("type", QString::fromLatin1(type));
+    label->setTextFormat(Qt::PlainText);
+    label->setWordWrap(true);
+    return label;
+}
+
+void setRole(QWidget* widget, const char* role) {
+    widget->setProperty("role", QString::fromLatin1(role));
+}
+
+void changeRole(QWidget* widget, const char* role) {
+    if (widget->property("role").toString() == QLatin1StringView(role))
+        return;
+    setRole(widget, role);
+    widget->setStyleSheet(widget->styleSheet());
+}
+
+void setButtonIcon(QAbstractButton* button, const Theme& theme, const QString& icon, QColor colour) {
+    const int size = theme.size(Sign::Button);
+    button->setIcon(theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
+    button->setIconSize({size, size});
+}
+
+void Maker::add(QBoxLayout& to, std::initializer_list<Item> items) const {
+    for (const Item& item : items) {
+        if (item.widget)
+            to.addWidget(item.widget, item.stretch, item.alignment);
+        else if (item.layout)
+            to.addLayout(item.layout, item.stretch);
+        else if (item.stretch > 0)
+            to.addStretch(item.stretch);
+        else
+            to.addSpacing(m_theme.size(item.space));
+    }
+}
+
+QHBoxLayout* Maker::inRow(Space gap, std::initializer_list<Item> items) const {
+    auto* row = new QHBoxLayout;
+    row->setSpacing(m_theme.size(gap));
+    add(*row, items);
+    return row;
+}
+
+QVBoxLayout* Maker::inColumn(Space gap, std::initializer_list<Item> items) const {
+    auto* column = new QVBoxLayout;
+    column->setSpacing(m_theme.size(gap));
+    add(*column, items);
+    return column;
+}
+
+QGridLayout* Maker::inGrid(Space gap) const {
+    auto* grid = new QGridLayout;
+    grid->setSpacing(m_theme.size(gap));
+    return grid;
+}
+
+QWidget* Maker::inBox(QLayout* inside) const {
+    auto* box = new QWidget(m_parent);
+    inside->setContentsMargins(0, 0, 0, 0);
+    box->setLayout(inside);
+    return box;
+}
+
+QWidget* Maker::leftToRight(QLayout* inside) const {
+    QWidget* box = inBox(inside);
+    box->setLayoutDirection(Qt::LeftToRight);
+    return box;
+}
+
+QWidget* Maker::inMiddle(QWidget* inside, int share) const {
+    return inBox(inRow(Space::None, {Item::room(), {inside, share}, Item::room()}));
+}
+
+Card Maker::makeCard(const char* role, Pad pad, Space gap) const {
+    auto* frame = new QFrame(m_parent);
+    setRole(frame, role);
+    QVBoxLayout* column = inColumn(gap);
+    column->setContentsMargins(m_theme.margins(pad));
+    frame->setLayout(column);
+    return {frame, column};
+}
+
+QLabel* Maker::words(const char* type, const QString& text) const {
+    QLabel* label = makeLabel(m_parent, type);
+    label->setText(text);
+    return label;
+}
+
+QLabel* Maker::oneLine(const char* type) const {
+    QLabel* label = makeLabel(m_parent, type);
+    label->setWordWrap(false);
+    return label;
+}
+
+QLabel* Maker::sign(const QString& icon, Sign size, QColor colour) const {
+    auto* label = new QLabel(m_parent);
+    label->setPixmap(m_theme.icon(icon, m_theme.size(size), colour));
+    return label;
+}
+
+QPushButton* Maker::plainButton(const QString& name, const char* role, std::function<void()> clicked) const {
+    auto* button = new QPushButton(m_parent);
+    setRole(button, role);
+    button->setObjectName(name);
+    button->setFocusPolicy(Qt::TabFocus);
+    QObject::connect(button, &QPushButton::clicked, m_parent, [clicked = std::move(clicked)] { clicked(); });
+    return button;
+}
+
+} // namespace lumora

@@ -1,0 +1,82 @@
+#include "views/window/PageFrame.h"
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+PageFrame::PageFrame(const Theme& theme, QWidget* parent)
+    : QWidget(parent)
+    , Maker(theme, this) {
+    auto* header = new QFrame(this);
+    setRole(header, "header");
+    m_headerActions = inRow(Space::Tight);
+    m_steps = new StepBar(theme, header);
+    QLabel* name = oneLine("large");
+    name->setText(u"Lumora"_s);
+    auto* mark = new QLabel(header);
+    mark->setPixmap(theme.icon(u"lumora"_s, theme.px(38), Theme::Colour::Primary));
+    auto* headerRow = inRow(Space::Normal, {mark, name, {m_steps, 1}, m_headerActions});
+    headerRow->setContentsMargins(theme.margin(), theme.px(8), theme.margin(), theme.px(6));
+    header->setLayout(headerRow);
+    m_header = header;
+
+    m_title = words("title");
+    m_subtitle = words("muted");
+    m_titleBlock = new QWidget(this);
+    auto* titleColumn = inColumn(Space::None, {m_title, m_subtitle});
+    titleColumn->setContentsMargins(theme.margin(), theme.size(Space::Wide), theme.margin(), 0);
+    m_titleBlock->setLayout(titleColumn);
+
+    m_content = inColumn(Space::Normal);
+    auto* body = new QWidget(this);
+    m_content->setContentsMargins(theme.margin(), theme.px(14), theme.margin(), theme.px(14));
+    body->setLayout(m_content);
+
+    m_secondary = inRow(Space::Normal);
+    m_status = inRow(Space::Normal);
+    m_main = inRow(Space::Normal);
+    auto* bar = new QFrame(this);
+    setRole(bar, "bar");
+    auto* barRow = inRow(Space::Normal, {m_secondary, Item::room(), m_status, Item::room(), m_main});
+    barRow->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.gap());
+    bar->setLayout(barRow);
+    bar->setMinimumHeight(theme.px(58) + 2 * theme.gap() + 2);
+    m_bar = bar;
+
+    setLayout(inColumn(Space::None, {m_header, m_titleBlock, {body, 1}, m_bar}));
+    layout()->setContentsMargins(0, 0, 0, 0);
+}
+
+void PageFrame::setTitle(const QString& title, const QString& subtitle) {
+    m_title->setText(isolated(title));
+    m_subtitle->setText(isolated(subtitle));
+    m_subtitle->setVisible(!subtitle.isEmpty());
+}
+
+void PageFrame::setTitleVisible(bool visible) {
+    m_titleBlock->setVisible(visible);
+}
+
+void PageFrame::showContentOnly() {
+    m_header->hide();
+    m_titleBlock->hide();
+    m_bar->hide();
+}
+
+void PageFrame::addHeaderActions(std::initializer_list<Item> items) {
+    add(*m_headerActions, items);
+}
+
+void PageFrame::addMainActions(std::initializer_list<Item> items) {
+    add(*m_main, items);
+}
+
+void PageFrame::addSecondaryActions(std::initializer_list<Item> items) {
+    add(*m_secondary, items);
+}
+
+void PageFrame::addStatus(std::initializer_list<Item> items) {
+    add(*m_status, items);
+}
+
+} // namespace lumora
