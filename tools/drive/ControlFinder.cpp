@@ -87,20 +87,31 @@ void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers m
     QApplication::sendEvent(&widget, &release);
 }
 
-Result<const PageView::Control*> boundIn(const Result<PageView*>& view, const QString& page, const QString& control) {
+// The control as the view shows it; where no widget does, as the page holds it.
+Result<PageView::Control> controlIn(const Result<PageView*>& view, const QString& page, const QString& control) {
     if (!view)
         return view.failure();
-    if (const PageView::Control* bound = (*view)->control(control))
-        return bound;
-    return fail(u"%1 has no control %2"_s.arg(page, control));
+    const PageView::Control* bound = (*view)->control(control);
+    PageView::Control found = bound ? *bound : PageView::Control{};
+    for (const Controls::Entry& entry : (*view)->page().controls().all()) {
+        if (entry.name != control)
+            continue;
+        found.name = control;
+        if (!bound && entry.caption)
+            found.caption = entry.caption;
+        if (!found.list)
+            found.list = entry.list;
+    }
+    return found.name.isEmpty() ? Result<PageView::Control>(fail(u"%1 has no control %2"_s.arg(page, control)))
+                                : Result<PageView::Control>(found);
 }
 
 Result<const TextList*> listIn(const Result<PageView*>& view, const QString& page, const QString& control) {
     if (!view)
         return view.failure();
-    const PageView::Control* bound = (*view)->control(control);
-    if (bound && bound->list)
-        return bound->list;
+    const Result<PageView::Control> found = controlIn(view, page, control);
+    if (found && found->list)
+        return found->list;
     return fail(u"%1 has no list %2"_s.arg(page, control));
 }
 
@@ -295,10 +306,10 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
 }
 
 Result<QString> ControlFinder::text(const QString& page, const QString& control) const {
-    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    const Result<PageView::Control> found = controlIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control& is = **found;
+    const PageView::Control& is = *found;
     if (is.text)
         return is.text();
     if (is.caption)
@@ -309,18 +320,18 @@ Result<QString> ControlFinder::text(const QString& page, const QString& control)
 }
 
 Result<bool> ControlFinder::visible(const QString& page, const QString& control) const {
-    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    const Result<PageView::Control> found = controlIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const QWidget* widget = (*found)->widget;
+    const QWidget* widget = found->widget;
     return widget && widget->isVisible();
 }
 
 Result<bool> ControlFinder::enabled(const QString& page, const QString& control) const {
-    const Result<const PageView::Control*> found = boundIn(view(page), page, control);
+    const Result<PageView::Control> found = controlIn(view(page), page, control);
     if (!found)
         return found.failure();
-    const PageView::Control& is = **found;
+    const PageView::Control& is = *found;
     return is.widget ? is.widget->isEnabled() : is.caption && is.caption->enabled;
 }
 

@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-class HavharotView : public PageView {
+class HavharotView : public ViewOf<Havharot> {
     Q_OBJECT
 public:
     HavharotView(Havharot& page, const SessionState& state, const Theme& theme);
@@ -16,7 +16,6 @@ protected:
     void render() override;
 
 private:
-    Havharot& m_page;
     QPushButton* m_goOn;
 };
 

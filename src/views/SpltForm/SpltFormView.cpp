@@ -3,32 +3,22 @@
 #include "common/DrivePathText.h"
 #include "order/PieceName.h"
 
-#include <QHBoxLayout>
-#include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
 #include <QProgressBar>
-#include <QPushButton>
-#include <QVBoxLayout>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
 SpltFormView::SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme)
-    : PageView(page, state, theme)
-    , m_page(page) {
+    : ViewOf(page, state, theme) {
     // No part of an order's way; its room keeps the name at its place.
     QSizePolicy room = frame().steps().sizePolicy();
     room.setRetainSizeWhenHidden(true);
     frame().steps().setSizePolicy(room);
     frame().steps().hide();
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.px(20));
-    row->addWidget(makeCut(), 2);
-    row->addWidget(makeJoin(), 3);
-    frame().content()->setSpacing(theme.px(12));
-    frame().content()->addLayout(row, 1);
+    frame().content()->addLayout(inRow(Space::Wide, {{makeCut(), 2}, {makeJoin(), 3}}), 1);
     frame().content()->addWidget(makeResult());
     makeBars();
     start();
@@ -38,10 +28,9 @@ QWidget* SpltFormView::firstFocus() const {
     return m_cutFolder;
 }
 
-QListWidget* SpltFormView::makeList(QVBoxLayout& column, const QString& name, const TextList& list,
-                                    const QString& hebrew, const QString& english, int stretch,
-                                    void (SpltForm::*clicked)(int)) {
-    auto* title = makeLabel(this, "smallMuted");
+QVBoxLayout* SpltFormView::makeList(const QString& name, const TextList& list, const QString& hebrew,
+                                    const QString& english, void (SpltForm::*clicked)(int)) {
+    QLabel* title = words("smallMuted");
     auto* widget = new QListWidget(this);
     widget->setTextElideMode(Qt::ElideMiddle);
     widget->setProperty("names", true);
@@ -63,121 +52,82 @@ QListWidget* SpltFormView::makeList(QVBoxLayout& column, const QString& name, co
     }
     bindList(name, list, widget, LeafName);
     title->setBuddy(widget);
-    column.addWidget(title);
-    column.addWidget(widget, stretch);
     m_titles.push_back({title, widget, hebrew, english});
-    return widget;
+    return inColumn(Space::Small, {title, {widget, 1}});
 }
 
 // The chief work of a column. The bottom bar's main action would be one too many here.
-QPushButton* SpltFormView::workButton(const QString& name, const Caption& caption, std::function<void()> clicked) {
-    auto* made = button(name, caption, Role::Main, std::move(clicked));
+QPushButton* SpltFormView::workButton(const QString& name, const Caption& caption, void (SpltForm::*clicked)()) {
+    QPushButton* made = button(name, caption, Role::Main, clicked);
     setRole(made, "done");
     return made;
 }
 
 QWidget* SpltFormView::makeCut() {
-    auto* card = new QFrame(this);
-    setRole(card, "card");
-    auto* column = new QVBoxLayout(card);
-    column->setContentsMargins(theme().px(18), theme().px(14), theme().px(18), theme().px(16));
-    column->setSpacing(theme().px(8));
-    m_cutHead = makeLabel(card, "large");
-    column->addWidget(m_cutHead);
-    m_cutFolder = button(
-        u"Command2"_s, m_page.Command2, Role::Plain, [this] { m_page.Command2_Click(); }, u"folder"_s);
-    column->addWidget(m_cutFolder);
-    makeList(*column, u"List4files"_s, m_page.List4files, u"הקבצים לחיתוך"_s, u"Files to cut"_s, 1);
-    auto* size = new QHBoxLayout;
-    size->setSpacing(theme().px(10));
-    auto* sizeTitle = label(u"Label4Text2"_s, m_page.Label4Text2, "smallMuted");
-    size->addWidget(sizeTitle, 1);
-    auto* edit = field(u"Text2"_s, m_page.Text2, [this](const QString& text) { m_page.Text2_Change(text); });
+    m_cutHead = words("large");
+    m_cutFolder = button(u"Command2"_s, m_page.Command2, Role::Plain, &SpltForm::Command2_Click, u"folder"_s);
+    QLayout* list = makeList(u"List4files"_s, m_page.List4files, u"הקבצים לחיתוך"_s, u"Files to cut"_s);
+    QLabel* sizeTitle = label(u"Label4Text2"_s, m_page.Label4Text2, "smallMuted");
+    QLineEdit* edit = field(u"Text2"_s, m_page.Text2, toPage(&SpltForm::Text2_Change));
     edit->setLayoutDirection(Qt::LeftToRight);
     edit->setInputMethodHints(Qt::ImhDigitsOnly);
     edit->setFixedWidth(theme().px(150));
     sizeTitle->setBuddy(edit);
-    size->addWidget(edit);
-    column->addLayout(size);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme().px(10));
-    row->addWidget(workButton(u"Command3"_s, m_page.Command3, [this] { m_page.Command3_Click(); }), 1);
-    row->addWidget(button(u"Command9"_s, m_page.Command9, Role::Plain, [this] { m_page.Command9_Click(); }));
-    column->addLayout(row);
-    return card;
+    const Card card = makeCard("card", Pad::Normal);
+    add(*card.column,
+        {m_cutHead,
+         m_cutFolder,
+         {list, 1},
+         inRow(Space::Small, {{sizeTitle, 1}, edit}),
+         inRow(Space::Small, {{workButton(u"Command3"_s, m_page.Command3, &SpltForm::Command3_Click), 1},
+                              button(u"Command9"_s, m_page.Command9, Role::Plain, &SpltForm::Command9_Click)})});
+    return card.frame;
 }
 
 QWidget* SpltFormView::makeJoin() {
-    auto* card = new QFrame(this);
-    setRole(card, "card");
-    auto* column = new QVBoxLayout(card);
-    column->setContentsMargins(theme().px(18), theme().px(14), theme().px(18), theme().px(16));
-    column->setSpacing(theme().px(8));
-    auto* head = new QHBoxLayout;
-    m_joinHead = makeLabel(card, "large");
-    head->addWidget(m_joinHead, 1);
-    m_counts = makeLabel(card, "smallMuted");
-    m_counts->setWordWrap(false);
-    head->addWidget(m_counts);
-    column->addLayout(head);
-    column->addWidget(button(
-        u"Command8"_s, m_page.Command8, Role::Plain, [this] { m_page.Command8_Click(); }, u"folder-plus"_s));
-
-    auto* lists = new QHBoxLayout;
-    lists->setSpacing(theme().px(12));
-    auto* left = new QVBoxLayout;
-    left->setSpacing(theme().px(6));
-    m_families = makeList(*left, u"List4Bodedim"_s, m_page.List4Bodedim, u"משפחות"_s, u"Families"_s, 1,
-                          &SpltForm::List4Bodedim_Click);
+    m_joinHead = words("large");
+    m_counts = oneLine("smallMuted");
+    QPushButton* folder =
+        button(u"Command8"_s, m_page.Command8, Role::Plain, &SpltForm::Command8_Click, u"folder-plus"_s);
+    QLayout* families =
+        makeList(u"List4Bodedim"_s, m_page.List4Bodedim, u"משפחות"_s, u"Families"_s, &SpltForm::List4Bodedim_Click);
+    m_families = m_titles.back().list;
     m_families->unsetLayoutDirection();
     m_families->setProperty("names", false);
-    lists->addLayout(left, 1);
-    auto* right = new QVBoxLayout;
-    right->setSpacing(theme().px(6));
-    makeList(*right, u"List4Famely"_s, m_page.List4Famely, u"חלקי המשפחה שנבחרה"_s, u"Pieces of the chosen family"_s,
-             2);
-    makeList(*right, u"ListChalakim"_s, m_page.ListChalakim, u"כל הקבצים שנקראו"_s, u"All the files read"_s, 3,
-             &SpltForm::ListChalakim_Click);
-    lists->addLayout(right, 1);
-    m_length = makeLabel(card, "smallMuted");
-    m_length->setWordWrap(false);
+    QLayout* family =
+        makeList(u"List4Famely"_s, m_page.List4Famely, u"חלקי המשפחה שנבחרה"_s, u"Pieces of the chosen family"_s);
+    QLayout* all = makeList(u"ListChalakim"_s, m_page.ListChalakim, u"כל הקבצים שנקראו"_s, u"All the files read"_s,
+                            &SpltForm::ListChalakim_Click);
+    m_length = oneLine("smallMuted");
     m_length->setAlignment(Qt::AlignTrailing | Qt::AlignVCenter);
-    right->addWidget(m_length);
-    column->addLayout(lists, 1);
-
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme().px(10));
-    row->addWidget(workButton(u"Command1"_s, m_page.Command1, [this] { m_page.Command1_Click(); }), 1);
-    row->addWidget(button(u"Command4"_s, m_page.Command4, Role::Plain, [this] { m_page.Command4_Click(); }), 1);
-    row->addWidget(button(u"Command6"_s, m_page.Command6, Role::Plain, [this] { m_page.Command6_Click(); }));
-    column->addLayout(row);
+    const Card card = makeCard("card", Pad::Normal);
+    add(*card.column,
+        {inRow(Space::Small, {{m_joinHead, 1}, m_counts}),
+         folder,
+         {inRow(Space::Normal, {{families, 1}, {inColumn(Space::Small, {{family, 2}, {all, 3}, m_length}), 1}}), 1},
+         inRow(Space::Small, {{workButton(u"Command1"_s, m_page.Command1, &SpltForm::Command1_Click), 1},
+                              {button(u"Command4"_s, m_page.Command4, Role::Plain, &SpltForm::Command4_Click), 1},
+                              button(u"Command6"_s, m_page.Command6, Role::Plain, &SpltForm::Command6_Click)})});
     bindHidden(u"Command5"_s, m_page.Command5);
     bindHidden(u"Label1"_s, m_page.Label1);
     bindHidden(u"Label5"_s, m_page.Label5);
     bindHidden(u"Label8"_s, m_page.Label8);
     bindHidden(u"Label9"_s, m_page.Label9);
-    return card;
+    return card.frame;
 }
 
 QWidget* SpltFormView::makeResult() {
-    m_result = new QFrame(this);
-    auto* row = new QHBoxLayout(m_result);
-    row->setContentsMargins(theme().px(18), theme().px(8), theme().px(18), theme().px(8));
-    row->setSpacing(theme().px(14));
-    m_resultSign = new QLabel(m_result);
-    row->addWidget(m_resultSign);
-    auto* words = new QVBoxLayout;
-    words->setSpacing(theme().px(2));
-    m_resultLine = makeLabel(m_result, "strong");
-    words->addWidget(m_resultLine);
-    m_resultWhere = makeLabel(m_result, "smallMuted");
-    words->addWidget(m_resultWhere);
-    m_progress = new QProgressBar(m_result);
+    m_resultSign = new QLabel(this);
+    m_resultLine = words("strong");
+    m_resultWhere = words("smallMuted");
+    m_progress = new QProgressBar(this);
     m_progress->setRange(0, 100);
     m_progress->setTextVisible(false);
-    words->addWidget(m_progress);
-    row->addLayout(words, 1);
+    const Card card = makeCard("well", Pad::Slim);
+    m_result = card.frame;
     m_result->setMinimumHeight(theme().px(64));
+    card.column->addLayout(
+        inRow(Space::Normal, {m_resultSign, {inColumn(Space::None, {m_resultLine, m_resultWhere, m_progress}), 1}}));
     bind(u"Label4Total"_s, m_resultLine, [this] { return m_page.Label4Total.text; });
     bind(u"Label4Where"_s, m_resultWhere, [this] { return m_page.Label4Where.text; });
     bindHidden(u"Label4Work"_s, m_page.Label4Work);
@@ -185,9 +135,9 @@ QWidget* SpltFormView::makeResult() {
 }
 
 void SpltFormView::makeBars() {
-    frame().addSecondaryAction(button(u"Image3"_s, m_page.Image3, Role::Secondary, [this] { m_page.Image3_Click(); }));
-    frame().addMainAction(button(
-        u"Command15"_s, m_page.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"stop"_s));
+    frame().addSecondaryAction(button(u"Image3"_s, m_page.Image3, Role::Secondary, &SpltForm::Image3_Click));
+    frame().addMainAction(
+        button(u"Command15"_s, m_page.Command15, Role::Danger, &SpltForm::Command15_Click, u"stop"_s));
 }
 
 void SpltFormView::render() {

@@ -9,7 +9,7 @@ class QProgressBar;
 
 namespace lumora {
 
-class SpltFormView : public PageView {
+class SpltFormView : public ViewOf<SpltForm> {
     Q_OBJECT
 public:
     SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme);
@@ -24,13 +24,12 @@ private:
     QWidget* makeResult();
     void makeBars();
     // A list with its title over it. clicked null: only to look at.
-    QListWidget* makeList(QVBoxLayout& column, const QString& name, const TextList& list, const QString& hebrew,
-                          const QString& english, int stretch, void (SpltForm::*clicked)(int) = nullptr);
-    QPushButton* workButton(const QString& name, const Caption& caption, std::function<void()> clicked);
+    QVBoxLayout* makeList(const QString& name, const TextList& list, const QString& hebrew, const QString& english,
+                          void (SpltForm::*clicked)(int) = nullptr);
+    QPushButton* workButton(const QString& name, const Caption& caption, void (SpltForm::*clicked)());
     void renderFamilies();
     void renderResult();
 
-    SpltForm& m_page;
     QLabel* m_cutHead = nullptr;
     QLabel* m_joinHead = nullptr;
     QLabel* m_counts = nullptr;

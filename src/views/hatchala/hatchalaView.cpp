@@ -7,13 +7,8 @@
 
 #include <QEvent>
 #include <QFocusEvent>
-#include <QGridLayout>
-#include <QHBoxLayout>
-#include <QLabel>
 #include <QListWidget>
 #include <QMouseEvent>
-#include <QPushButton>
-#include <QVBoxLayout>
 
 namespace lumora {
 
@@ -30,22 +25,17 @@ void keepPlaceWhenHidden(QWidget& widget) {
 } // namespace
 
 hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files)
-    : PageView(page, state, theme)
-    , m_page(page)
+    : ViewOf(page, state, theme)
     , m_files(files) {
     frame().steps().setStep(OrderStep::Start);
     frame().setTitleVisible(false);
     makeHeader();
     // Words at the beginning of the reading direction, the picture beside them.
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.px(36));
-    row->addLayout(makeWords(), 5);
-    row->addLayout(makeSide(), 5);
-    frame().content()->addLayout(row, 1);
+    frame().content()->addLayout(inRow(Space::Far, {{makeWords(), 5}, {makeSide(), 5}}), 1);
     makeStart();
     m_arrow = new ArrowStrip(theme, m_start, this);
-    frame().content()->setSpacing(theme.px(4));
-    frame().content()->setContentsMargins(theme.margin(), theme.px(14), theme.margin(), theme.px(4));
+    frame().content()->setSpacing(theme.size(Space::Tight));
+    frame().content()->setContentsMargins(theme.margin(), theme.px(14), theme.margin(), theme.size(Space::Tight));
     frame().content()->addWidget(m_arrow);
     makeShops();
 
@@ -68,203 +58,127 @@ void hatchalaView::makeHeader() {
     english->setFocusPolicy(Qt::TabFocus);
     setIcon(english, u"globe"_s, Theme::Colour::Ink);
     english->setCheckable(true);
-    connect(english, &QPushButton::clicked, this, [this](bool on) { m_page.Check1_Click(on); });
+    connect(english, &QPushButton::clicked, this, toPage(&hatchala::Check1_Click));
     bind(u"Check1"_s, english, m_page.Check1);
-    frame().addHeaderAction(english);
-    auto* leave = button(
-        u"Image3"_s, m_page.Image3, Role::Quiet, [this] { m_page.Image3_MouseDown(); }, u"exit"_s);
-    frame().addHeaderAction(leave);
+    QPushButton* leave = button(u"Image3"_s, m_page.Image3, Role::Quiet, &hatchala::Image3_MouseDown, u"exit"_s);
     helpFor(leave, hatchala::Hover::Image3);
+    frame().addHeaderActions({english, leave});
 }
 
 QLayout* hatchalaView::makeWords() {
-    auto* words = new QVBoxLayout;
-    words->setSpacing(theme().px(14));
-    m_noticeBox = new QFrame(this);
-    setRole(m_noticeBox, "success");
-    auto* noticeRow = new QHBoxLayout(m_noticeBox);
-    noticeRow->setContentsMargins(theme().px(18), theme().px(12), theme().px(18), theme().px(12));
-    noticeRow->addWidget(label(u"Notice"_s, m_page.Notice, "strong"));
-    words->addWidget(m_noticeBox);
-    words->addStretch(1);
+    const Card notice = makeCard("success", Pad::Normal);
+    m_noticeBox = notice.frame;
+    notice.column->addWidget(label(u"Notice"_s, m_page.Notice, "strong"));
     m_headline = label(u"Title"_s, m_page.Title, "display");
-    words->addWidget(m_headline);
-    m_how = makeLabel(this, "muted");
-    words->addWidget(m_how);
+    m_how = words("muted");
+    QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline, m_how});
     for (const QString& icon : {u"pictures"_s, u"printer"_s, u"send"_s}) {
-        auto* line = new QHBoxLayout;
-        line->setSpacing(theme().px(14));
-        auto* sign = new QLabel(this);
-        sign->setPixmap(theme().icon(icon, theme().px(30), Theme::Colour::Primary));
-        line->addWidget(sign);
-        m_steps.push_back(makeLabel(this, "body"));
-        line->addWidget(m_steps.back(), 1);
-        words->addLayout(line);
+        m_steps.push_back(words("body"));
+        column->addLayout(inRow(Space::Normal, {sign(icon, Sign::Line), {m_steps.back(), 1}}));
     }
-    words->addStretch(1);
-    auto* links = new QHBoxLayout;
-    links->setSpacing(theme().gap());
-    auto* prices = button(
-        u"Image11"_s, m_page.Image11, Role::Plain, [this] { m_page.Image11_Click(); }, u"tag"_s);
-    auto* site = button(
-        u"Image5"_s, m_page.Image5, Role::Plain, [this] { m_page.Image5_Click(); }, u"globe"_s);
+    QPushButton* prices = button(u"Image11"_s, m_page.Image11, Role::Plain, &hatchala::Image11_Click, u"tag"_s);
+    QPushButton* site = button(u"Image5"_s, m_page.Image5, Role::Plain, &hatchala::Image5_Click, u"globe"_s);
     helpFor(prices, hatchala::Hover::Image11);
     helpFor(site, hatchala::Hover::Image5);
-    links->addWidget(prices);
-    links->addWidget(site);
     m_hints.push_back(makeHint(u"Label3"_s, m_page.Label3, {}));
-    links->addWidget(m_hints.back().box);
-    links->addStretch(1);
-    words->addLayout(links);
-    return words;
+    add(*column, {Item::room(), inRow(Space::Normal, {prices, site, m_hints.back().box, Item::room()})});
+    return column;
 }
 
 QLayout* hatchalaView::makeSide() {
-    auto* side = new QVBoxLayout;
-    side->setSpacing(theme().px(10));
     // Right below the button that it speaks of.
     m_hints.push_back(makeHint(u"Label4"_s, m_page.Label4, u"exit"_s));
-    side->addWidget(m_hints.back().box, 0, Qt::AlignTrailing);
-    side->addWidget(makeStage(), 1);
+    QWidget* stage = makeStage();
     m_advert = new AdvertisingPicture(theme(), this);
     bind(u"Picture4"_s, m_advert, [this] { return m_page.Picture4; });
-    side->addWidget(m_advert, 0, Qt::AlignCenter);
-    side->addWidget(makeContact(), 0, Qt::AlignCenter);
-    return side;
+    return inColumn(Space::Small, {{m_hints.back().box, 0, Qt::AlignTrailing},
+                                   {stage, 1},
+                                   {m_advert, 0, Qt::AlignCenter},
+                                   {makeContact(), 0, Qt::AlignCenter}});
 }
 
 // The prints, and in their place what the control in hand does.
 QWidget* hatchalaView::makeStage() {
-    auto* stage = new QWidget(this);
-    auto* column = new QVBoxLayout(stage);
-    column->setContentsMargins(0, 0, 0, 0);
-    auto* over = new QWidget(stage);
-    auto* place = new QGridLayout(over);
-    place->setContentsMargins(0, 0, 0, 0);
-    m_prints = new Prints(over);
-    place->addWidget(m_prints, 0, 0);
-    auto* help = new QWidget(over);
-    help->setAttribute(Qt::WA_TransparentForMouseEvents);
-    auto* helpColumn = new QVBoxLayout(help);
-    helpColumn->setContentsMargins(0, 0, 0, 0);
-    helpColumn->setSpacing(theme().px(8));
-    auto* head = label(u"Picture3"_s, m_page.Picture3, "muted");
-    head->setMinimumHeight(theme().px(32));
+    m_prints = new Prints(this);
+    QLabel* head = label(u"Picture3"_s, m_page.Picture3, "muted");
+    head->setMinimumHeight(theme().size(Sign::Line));
     head->setAlignment(Qt::AlignCenter);
     keepPlaceWhenHidden(*head);
-    helpColumn->addStretch(2);
-    helpColumn->addWidget(head);
-    helpColumn->addWidget(makeHelp(hatchala::Hover::Image1, u"play"_s, help));
-    helpColumn->addWidget(makeHelp(hatchala::Hover::Image11, u"tag"_s, help));
-    helpColumn->addWidget(makeHelp(hatchala::Hover::Image5, u"globe"_s, help));
-    helpColumn->addWidget(makeHelp(hatchala::Hover::Image3, u"exit"_s, help));
-    helpColumn->addWidget(makeHelp(hatchala::Hover::Image6, u"phone"_s, help));
-    helpColumn->addStretch(3);
+    using enum hatchala::Hover;
+    QWidget* help =
+        inBox(inColumn(Space::Small, {Item::room(2), head, makeHelp(Image1, u"play"_s), makeHelp(Image11, u"tag"_s),
+                                      makeHelp(Image5, u"globe"_s), makeHelp(Image3, u"exit"_s),
+                                      makeHelp(Image6, u"phone"_s), Item::room(3)}));
+    help->setAttribute(Qt::WA_TransparentForMouseEvents);
+    auto* place = inGrid(Space::None);
+    place->addWidget(m_prints, 0, 0);
     place->addWidget(help, 0, 0);
-    column->addWidget(over, 1);
     // Their place in the state is the one of the prints at the back and of the one in front.
     bindHidden(u"Picture2"_s, m_page.Picture2);
     bindHidden(u"Image2"_s, m_page.Image2);
-    return stage;
+    return inBox(place);
 }
 
-QWidget* hatchalaView::makeHelp(hatchala::Hover over, const QString& icon, QWidget* parent) {
-    auto* card = new QFrame(parent);
-    setRole(card, "card");
-    auto* row = new QHBoxLayout(card);
-    row->setContentsMargins(theme().px(22), theme().px(20), theme().px(22), theme().px(20));
-    row->setSpacing(theme().px(18));
-    auto* sign = new QLabel(card);
-    sign->setPixmap(theme().icon(icon, theme().px(52), Theme::Colour::Primary));
-    row->addWidget(sign);
-    auto* text = makeLabel(card, "large");
-    row->addWidget(text, 1);
-    m_helps.push_back({over, text});
-    const Caption& caption = m_page.Image12[static_cast<std::size_t>(over)];
-    bind(u"Image12(%1)"_s.arg(static_cast<int>(over)), card, caption);
-    return card;
+QWidget* hatchalaView::makeHelp(hatchala::Hover over, const QString& icon) {
+    const Card card = makeCard("card", Pad::Wide);
+    m_helps.push_back({over, words("large")});
+    card.column->addLayout(inRow(Space::Wide, {sign(icon, Sign::Box), {m_helps.back().text, 1}}));
+    const auto at = static_cast<std::size_t>(over);
+    bind(numbered("Image12", at), card.frame, m_page.Image12[at]);
+    return card.frame;
 }
 
 hatchalaView::Hint hatchalaView::makeHint(const QString& name, const Caption& caption, const QString& icon) {
-    auto* box = new QWidget(this);
-    auto* row = new QHBoxLayout(box);
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(theme().px(8));
-    if (!icon.isEmpty()) {
-        auto* sign = new QLabel(box);
-        sign->setPixmap(theme().icon(icon, theme().px(20), Theme::Colour::Muted));
-        row->addWidget(sign);
-    }
-    auto* text = makeLabel(box, "smallMuted");
-    text->setWordWrap(false);
+    QLabel* text = oneLine("smallMuted");
+    QHBoxLayout* row = inRow(Space::Small);
+    if (!icon.isEmpty())
+        row->addWidget(sign(icon, Sign::Small, Theme::Colour::Muted));
     row->addWidget(text);
+    QWidget* box = inBox(row);
     bind(name, box, caption);
     return {&caption, box, text};
 }
 
 QWidget* hatchalaView::makeContact() {
-    auto* contact = new QWidget(this);
-    auto* row = new QHBoxLayout(contact);
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(theme().px(18));
     const auto entry = [&](const QString& icon, QLabel* text) {
-        auto* box = new QWidget(contact);
-        auto* line = new QHBoxLayout(box);
-        line->setContentsMargins(0, 0, 0, 0);
-        auto* sign = new QLabel(box);
-        sign->setPixmap(theme().icon(icon, theme().px(24), Theme::Colour::Primary));
-        line->addWidget(sign);
         text->setWordWrap(false);
-        line->addWidget(text);
-        row->addWidget(box);
-        return box;
+        return inBox(inRow(Space::Small, {sign(icon, Sign::Button), text}));
     };
     m_telephone = entry(u"phone"_s, label(u"Label4Tel"_s, m_page.Label4Tel, "strong"));
     m_mail = entry(u"mail"_s, label(u"Label1"_s, m_page.Label1, "body"));
+    QWidget* contact = inBox(inRow(Space::Wide, {m_telephone, m_mail}));
     bind(u"Image6"_s, contact, m_page.Image6);
     helpFor(contact, hatchala::Hover::Image6);
     return contact;
 }
 
 void hatchalaView::makeStart() {
-    m_start = new QPushButton(this);
-    setRole(m_start, "main");
-    m_start->setFocusPolicy(Qt::TabFocus);
-    connect(m_start, &QPushButton::pressed, this, [this] { m_page.Image1_MouseDown(); });
-    connect(m_start, &QPushButton::clicked, this, [this] {
+    m_start = plainButton(u"Image1"_s, "main", [this] {
         if (!isDetached())
             m_page.Image1_Click();
     });
+    connect(m_start, &QPushButton::pressed, this, toPage(&hatchala::Image1_MouseDown));
     bind(u"Image1"_s, m_start, m_page.Image1);
     frame().addMainAction(m_start);
-    frame().addSecondaryAction(button(
-        u"Image8"_s, m_page.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"globe"_s));
-    frame().addStatus(label(u"Label7"_s, m_page.Label7, "muted"));
-    frame().addStatus(label(u"Label6"_s, m_page.Label6, "large"));
+    frame().addSecondaryAction(button(u"Image8"_s, m_page.Image8, Role::Quiet, &hatchala::Image8_Click, u"globe"_s));
+    frame().addStatus({label(u"Label7"_s, m_page.Label7, "muted"), label(u"Label6"_s, m_page.Label6, "large")});
     helpFor(m_start, hatchala::Hover::Image1);
 }
 
 // The question at which shop the prints are fetched.
 void hatchalaView::makeShops() {
     m_shops = new Overlay(theme(), this);
-    m_ask = makeLabel(m_shops, "title");
-    m_shops->column()->addWidget(m_ask);
+    m_ask = words("title");
     auto* list = new QListWidget(m_shops);
     list->setFixedHeight(theme().px(130));
-    connect(list, &QListWidget::itemClicked, this,
-            [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
-    connect(list, &QListWidget::itemActivated, this,
-            [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); });
+    const auto taken = [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); };
+    connect(list, &QListWidget::itemClicked, this, taken);
+    connect(list, &QListWidget::itemActivated, this, taken);
     bindList(u"List1"_s, m_page.List1, list);
-    m_shops->column()->addWidget(list);
-    m_shopsBack = new QPushButton(m_shops);
-    setRole(m_shopsBack, "secondary");
-    m_shopsBack->setObjectName(u"shopsBack"_s);
-    m_shopsBack->setFocusPolicy(Qt::TabFocus);
-    connect(m_shopsBack, &QPushButton::clicked, this, [this] { m_page.Picture1_Escape(); });
-    m_shops->column()->addWidget(m_shopsBack, 0, Qt::AlignLeading);
+    m_shopsBack = plainButton(u"shopsBack"_s, "secondary", toPage(&hatchala::Picture1_Escape));
+    add(*m_shops->column(), {m_ask, list, {m_shopsBack, 0, Qt::AlignLeading}});
     m_shops->setFirstFocus(list);
-    connect(m_shops, &Overlay::escaped, this, [this] { m_page.Picture1_Escape(); });
+    m_shops->whenEscaped(toPage(&hatchala::Picture1_Escape));
     m_shopList = list;
     bind(u"Picture1"_s, m_shops->card(), [this] { return m_page.Picture1.text; });
 }

@@ -11,7 +11,7 @@ class AdvertisingPicture;
 class ArrowStrip;
 class Prints;
 
-class hatchalaView : public PageView {
+class hatchalaView : public ViewOf<hatchala> {
     Q_OBJECT
 public:
     hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files);
@@ -27,7 +27,7 @@ private:
     QLayout* makeWords();
     QLayout* makeSide();
     QWidget* makeStage();
-    QWidget* makeHelp(hatchala::Hover over, const QString& icon, QWidget* parent);
+    QWidget* makeHelp(hatchala::Hover over, const QString& icon);
     QWidget* makeContact();
     void makeStart();
     void makeShops();
@@ -36,7 +36,6 @@ private:
     void renderAdvert();
     void renderHelp();
 
-    hatchala& m_page;
     const Files& m_files;
     QPushButton* m_start = nullptr;
     QLabel* m_headline = nullptr;

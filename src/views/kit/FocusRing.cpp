@@ -7,12 +7,14 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 FocusRing::FocusRing(const Theme& theme, QWidget* window)
     : QWidget(window)
     , m_theme(theme) {
     setAttribute(Qt::WA_TransparentForMouseEvents);
     setFocusPolicy(Qt::NoFocus);
-    setObjectName(QStringLiteral("focusRing"));
+    setObjectName(u"focusRing"_s);
     hide();
     qApp->installEventFilter(this);
     connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {

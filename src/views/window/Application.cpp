@@ -7,10 +7,12 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 Application::Application(int& argc, char** argv)
     : QApplication(argc, argv) {
-    setApplicationName(QStringLiteral("lumora"));
-    setApplicationDisplayName(QStringLiteral("Lumora"));
+    setApplicationName(u"lumora"_s);
+    setApplicationDisplayName(u"Lumora"_s);
     setQuitOnLastWindowClosed(false);
     Theme::apply(*this);
 }

@@ -15,13 +15,15 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     : m_chain(chain)
     , m_state(state)
     , m_theme(std::make_unique<Theme>(1.0)) {
-    setObjectName(QStringLiteral("lumoraWindow"));
+    setObjectName(u"lumoraWindow"_s);
     setAttribute(Qt::WA_StyledBackground);
-    setWindowTitle(QStringLiteral("Lumora"));
+    setWindowTitle(u"Lumora"_s);
     setMinimumSize(800, 600);
     m_stack = new QStackedLayout(this);
     m_stack->setContentsMargins(0, 0, 0, 0);
@@ -84,7 +86,7 @@ void MainWindow::pageShown(Page* page) {
 void MainWindow::bringToFront(PageView* view) {
     PageView* const before = std::exchange(m_front, view);
     PageView* const uncovered = view->isPanel() ? nullptr : std::exchange(m_below, nullptr);
-    setWindowTitle(QStringLiteral("Lumora")); // a page with a title of its own sets it as it renders
+    setWindowTitle(u"Lumora"_s); // a page with a title of its own sets it as it renders
     setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     if (before && before != view && before->isPanel())
         before->hide();

@@ -1,56 +1,36 @@
 #include "views/window/MessagePanel.h"
 
-#include "views/kit/Maker.h"
-
-#include <QHBoxLayout>
-#include <QLabel>
-#include <QPushButton>
-#include <QVBoxLayout>
-
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const QString& title, const QString& text,
                            const QStringList& buttons)
     : Overlay(theme, parent) {
-    setObjectName(QStringLiteral("messagePanel"));
+    setObjectName(u"messagePanel"_s);
     setAccessibleName(title.isEmpty() ? text.simplified() : title);
     setCardWidth(600);
-    auto* top = new QHBoxLayout;
-    top->setSpacing(theme.px(20));
-    auto* sign = new QLabel(this);
-    sign->setPixmap(theme.icon(kind == Kind::Question ? QStringLiteral("info") : QStringLiteral("warning"),
-                               theme.px(44), Theme::Colour::Primary));
-    top->addWidget(sign, 0, Qt::AlignTop);
-    auto* words = new QVBoxLayout;
-    words->setSpacing(theme.px(8));
-    if (!title.isEmpty()) {
-        auto* head = makeLabel(this, "large");
-        head->setText(isolated(title));
-        words->addWidget(head);
-    }
-    auto* body = makeLabel(this, title.isEmpty() ? "strong" : "body");
-    body->setText(isolated(text.trimmed()));
-    body->setObjectName(QStringLiteral("messageText"));
+    QLabel* body = words(title.isEmpty() ? "strong" : "body", isolated(text.trimmed()));
+    body->setObjectName(u"messageText"_s);
     body->setAlignment(Qt::AlignLeading | Qt::AlignVCenter);
-    words->addWidget(body);
-    top->addLayout(words, 1);
-    column()->addLayout(top);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.gap());
-    row->addStretch(1);
+    QVBoxLayout* said = inColumn(Space::Small);
+    if (!title.isEmpty())
+        said->addWidget(words("large", isolated(title)));
+    said->addWidget(body);
+    addRow({{sign(kind == Kind::Question ? u"info"_s : u"warning"_s, Sign::Box), 0, Qt::AlignTop}, {said, 1}},
+           Space::Wide);
+    QHBoxLayout* row = inRow(Space::Normal, {Item::room()});
     for (int i = static_cast<int>(buttons.size()) - 1; i >= 0; --i) {
-        auto* button = new QPushButton(isolated(buttons[i]), this);
-        setRole(button, i == 0 ? "main" : "secondary");
-        button->setFocusPolicy(Qt::TabFocus);
+        QPushButton* button = plainButton(i == 0 ? u"messageYes"_s : u"messageNo"_s, i == 0 ? "main" : "secondary",
+                                          [this, i] { Q_EMIT answered(i == 0); });
+        button->setText(isolated(buttons[i]));
         button->setAccessibleName(buttons[i]);
-        button->setObjectName(i == 0 ? QStringLiteral("messageYes") : QStringLiteral("messageNo"));
-        connect(button, &QPushButton::clicked, this, [this, i] { Q_EMIT answered(i == 0); });
         row->addWidget(button);
         if (i == 0)
             setFirstFocus(button);
     }
     column()->addLayout(row);
-    connect(this, &Overlay::escaped, this, [this, kind] { Q_EMIT answered(kind == Kind::Message); });
+    whenEscaped([this, kind] { Q_EMIT answered(kind == Kind::Message); });
 }
 
 } // namespace lumora

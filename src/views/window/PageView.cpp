@@ -218,6 +218,16 @@ QLabel* PageView::label(const QString& name, const Caption& caption, const char*
     return made;
 }
 
+QLabel* PageView::lineLabel(const Caption& caption, const char* type) {
+    QLabel* made = label(caption, type);
+    made->setWordWrap(false);
+    return made;
+}
+
+void PageView::bindName(QWidget* widget, const Caption& caption) {
+    bind(nameOf(caption), widget, [&caption] { return caption.text; });
+}
+
 QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited) {
     auto* made = new QLineEdit(this);
     made->setProperty("ownRing", true); // its border tells

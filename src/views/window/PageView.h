@@ -76,30 +76,55 @@ protected:
     PageFrame& frame() const { return *m_frame; }
     void keyPressEvent(QKeyEvent* event) override;
 
-    // Makers of bound controls. The parent comes with the layout that they are added to.
+    // Makers of bound controls. The parent comes with the layout that they are added to. A control that carries its own
+    // name needs no other.
     QPushButton* button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
                         const QString& icon = {});
+    QPushButton* button(const Caption& caption, Role role, std::function<void()> clicked, const QString& icon = {}) {
+        return button(nameOf(caption), caption, role, std::move(clicked), icon);
+    }
     QLabel* label(const QString& name, const Caption& caption, const char* type = "body");
+    QLabel* label(const Caption& caption, const char* type = "body") { return label(nameOf(caption), caption, type); }
+    // A label that is never broken into lines.
+    QLabel* lineLabel(const Caption& caption, const char* type = "body");
     QLineEdit* field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited);
+    QLineEdit* field(const Caption& caption, std::function<void(const QString&)> edited) {
+        return field(nameOf(caption), caption, std::move(edited));
+    }
     QCheckBox* checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked);
+    QCheckBox* checkBox(const CheckCaption& caption, std::function<void(bool)> clicked) {
+        return checkBox(nameOf(caption), caption, std::move(clicked));
+    }
     // Rows from the list; what the box says from the caption, which may be a text that is no row.
     QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption,
                         std::function<void(int)> activated);
-
+    QComboBox* comboBox(const TextList& list, const Caption& caption, std::function<void(int)> activated) {
+        return comboBox(nameOf(caption), list, caption, std::move(activated));
+    }
     // The same as large cards, of which all rows are in sight.
     ChoiceCards* choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
                              std::function<CardButton*(int)> maker, std::function<void(int)> activated);
 
     // Binds a widget of the view's own making.
     void bind(const QString& name, QWidget* widget, const Caption& caption);
+    void bind(QWidget* widget, const Caption& caption) { bind(nameOf(caption), widget, caption); }
     // A button of the view's own making that can be chosen.
     void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
                     std::function<void()> clicked);
+    void bindChoice(QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked) {
+        bindChoice(nameOf(caption), button, caption, std::move(clicked));
+    }
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
-    // What has a name and is not seen.
+    // The widget has the control's name; the view itself renders what it says.
+    void bindName(QWidget* widget, const Caption& caption);
+    // What has a name and is not seen, of a page whose controls carry no names.
     void bindHidden(const QString& name, const Caption& caption);
     void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr,
                   std::function<QString(const QString&)> row = {});
+    void bindList(QWidget* widget, const TextList& list, std::function<QString(const QString&)> row = {}) {
+        bindList(m_page.controls().nameOf(list), list, widget, std::move(row));
+    }
+    QString nameOf(const Caption& caption) const { return m_page.controls().nameOf(caption); }
     // The icon of a button that points along the reading direction or against it.
     enum class Way { Back, Forwards };
     void setDirectedIcon(QPushButton* button, Way way);
@@ -144,6 +169,14 @@ protected:
         return button(
             name, caption, role, [&page = m_page, clicked, index] { (page.*clicked)(index); }, icon);
     }
+    QPushButton* button(const Caption& caption, Role role, void (P::*clicked)(), const QString& icon = {}) {
+        return button(nameOf(caption), caption, role, clicked, icon);
+    }
+    QPushButton* button(const Caption& caption, Role role, void (P::*clicked)(int), int index,
+                        const QString& icon = {}) {
+        return button(nameOf(caption), caption, role, clicked, index, icon);
+    }
+    // The page's handler as a function.
     auto toPage(void (P::*handler)()) const {
         return [&page = m_page, handler] { (page.*handler)(); };
     }

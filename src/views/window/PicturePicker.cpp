@@ -5,17 +5,12 @@
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
-#include "views/kit/Maker.h"
+#include "views/kit/Painting.h"
 
-#include <QHBoxLayout>
 #include <QKeyEvent>
-#include <QLabel>
 #include <QMouseEvent>
-#include <QPainter>
-#include <QPushButton>
 #include <QStandardPaths>
 #include <QStyledItemDelegate>
-#include <QVBoxLayout>
 
 #include <algorithm>
 
@@ -40,34 +35,28 @@ public:
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
         painter->save();
-        painter->setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
-        const QRectF cell = QRectF(option.rect).adjusted(m_theme.px(6), m_theme.px(6), -m_theme.px(6), -m_theme.px(6));
         const bool chosen = option.state & QStyle::State_Selected;
         const bool focused = option.state & QStyle::State_HasFocus;
-        painter->setPen(QPen(chosen ? Theme::Colour::Primary : Theme::Colour::Line, chosen ? m_theme.px(3) : 1));
-        painter->setBrush(chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface);
-        painter->drawRoundedRect(cell, m_theme.corner(), m_theme.corner());
-        if (focused && !chosen) {
-            painter->setPen(QPen(Theme::Colour::Focus, m_theme.px(3)));
-            painter->setBrush(Qt::NoBrush);
-            painter->drawRoundedRect(cell, m_theme.corner(), m_theme.corner());
-        }
+        const int inset = m_theme.px(6);
+        const QRectF cell = drawCard(*painter, option.rect.adjusted(inset, inset, -inset, -inset),
+                                     chosen    ? Theme::Colour::Primary
+                                     : focused ? Theme::Colour::Focus
+                                               : Theme::Colour::Line,
+                                     chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
+                                     chosen || focused ? m_theme.thick() : 1, m_theme.corner());
         const QRectF box = cell.adjusted(m_theme.px(10), m_theme.px(10), -m_theme.px(10), -m_theme.px(36));
         const QImage picture = index.data(PictureRole).value<QImage>();
         if (!picture.isNull()) {
-            const QSizeF fit = QSizeF(picture.size()).scaled(box.size(), Qt::KeepAspectRatio);
-            QRectF at(QPointF(), fit);
-            at.moveCenter(box.center());
-            painter->drawImage(at, picture);
+            drawImage(*painter, box, picture);
         } else {
             const bool folder = index.data(FolderRole).toBool();
-            const int size = m_theme.px(folder ? 68 : 44);
             const QString icon = folder                            ? u"folder"_s
                                  : index.data(PlainRole).toBool()  ? u"document"_s
                                  : index.data(BrokenRole).toBool() ? u"warning"_s
                                                                    : u"picture"_s;
-            painter->drawPixmap(QPointF(box.center().x() - size / 2.0, box.center().y() - size / 2.0),
-                                m_theme.icon(icon, size, folder ? Theme::Colour::Primary : Theme::Colour::Muted));
+            drawIcon(*painter, box.center(),
+                     m_theme.icon(icon, m_theme.px(folder ? 68 : 44),
+                                  folder ? Theme::Colour::Primary : Theme::Colour::Muted));
         }
         painter->setFont(m_theme.font(Theme::Type::Small));
         painter->setPen(Theme::Colour::Ink);
@@ -139,64 +128,49 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     setAccessibleName(title.isEmpty() ? prompt : title);
     setFilling();
 
-    auto* head = makeLabel(this, "title");
-    head->setText(isolated(prompt.trimmed()));
+    QLabel* head = words("title", isolated(prompt.trimmed()));
     head->setObjectName(u"pickerPrompt"_s);
-    column()->addWidget(head);
-    auto* guide = makeLabel(this, "muted");
-    guide->setText(isolated(
-        everyFile()
-            ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
-            : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
-                            u"Select only one image of a folder and the program will show you all the images"_s)));
+    QLabel* guide = words(
+        "muted",
+        isolated(
+            everyFile()
+                ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
+                : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                                u"Select only one image of a folder and the program will show you all the images"_s)));
     guide->setObjectName(u"pickerGuide"_s);
-    column()->addWidget(guide);
+    add(*column(), {head, guide});
 
-    auto* middle = new QHBoxLayout;
-    middle->setSpacing(theme.margin());
-    auto* side = new QVBoxLayout;
-    side->setSpacing(theme.px(8));
-    auto* sideTitle = makeLabel(this, "smallMuted");
-    sideTitle->setText(everyFile() ? state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
-                                   : state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s));
-    side->addWidget(sideTitle);
+    QVBoxLayout* side =
+        inColumn(Space::Small,
+                 {words("smallMuted", everyFile() ? state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
+                                                  : state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s))});
     m_places = places(initialFolder);
     for (std::size_t i = 0; i < m_places.size(); ++i) {
         const Place& place = m_places[i];
-        auto* button = new QPushButton(
-            theme.buttonIcon(place.icon, theme.px(24), Theme::Colour::Primary, Theme::Colour::Muted), QString(), this);
-        button->setIconSize({theme.px(24), theme.px(24)});
+        QPushButton* button = plainButton(u"place(%1)"_s.arg(i), "plain", [this, i] { open(m_places[i].folder); });
+        setButtonIcon(button, theme, place.icon, Theme::Colour::Primary);
         button->setText(
             QChar(0xA0) +
             button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, theme.px(130)).replace(u'&', u"&&"_s));
         button->setToolTip(toText(place.folder));
         button->setAccessibleName(place.name);
-        button->setObjectName(u"place(%1)"_s.arg(i));
         button->setCheckable(true);
-        button->setFocusPolicy(Qt::TabFocus);
         button->setFixedWidth(theme.px(210));
-        connect(button, &QPushButton::clicked, this, [this, i] { open(m_places[i].folder); });
         m_placeButtons.push_back(button);
         side->addWidget(button);
     }
     side->addStretch(1);
-    middle->addLayout(side);
 
-    auto* main = new QVBoxLayout;
-    main->setSpacing(theme.px(8));
-    auto* path = new QHBoxLayout;
-    m_up = new QPushButton(theme.buttonIcon(u"folder-up"_s, theme.px(24), Theme::Colour::Ink, Theme::Colour::Muted),
-                           state.wording(u"תיקייה מעל"_s, u"Folder above"_s), this);
-    m_up->setIconSize({theme.px(24), theme.px(24)});
-    m_up->setObjectName(u"pickerUp"_s);
-    m_up->setAccessibleName(m_up->text());
-    m_up->setFocusPolicy(Qt::TabFocus);
-    connect(m_up, &QPushButton::clicked, this, [this] { open(m_folder.parent_path()); });
-    path->addWidget(m_up);
-    m_where = makeLabel(this, "strong");
-    m_where->setWordWrap(false);
-    path->addWidget(m_where, 1);
-    main->addLayout(path);
+    const auto named = [&](const QString& name, const char* role, const QString& text, std::function<void()> clicked) {
+        QPushButton* button = plainButton(name, role, std::move(clicked));
+        button->setText(text);
+        button->setAccessibleName(text);
+        return button;
+    };
+    m_up = named(u"pickerUp"_s, "plain", state.wording(u"תיקייה מעל"_s, u"Folder above"_s),
+                 [this] { open(m_folder.parent_path()); });
+    setButtonIcon(m_up, theme, u"folder-up"_s, Theme::Colour::Ink);
+    m_where = oneLine("strong");
 
     auto* grid = new Grid(this);
     grid->up = [this] { m_up->click(); };
@@ -221,36 +195,22 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
         const QListWidgetItem* item = m_grid->currentItem();
         m_take->setEnabled(item && item->isSelected() && !item->data(FolderRole).toBool());
     });
-    main->addWidget(m_grid, 1);
-    m_empty = makeLabel(m_grid, "muted");
+    m_empty = words("muted");
     m_empty->setAlignment(Qt::AlignCenter);
-    auto* over = new QVBoxLayout(m_grid);
-    over->addWidget(m_empty);
     m_empty->setAttribute(Qt::WA_TransparentForMouseEvents);
-    middle->addLayout(main, 1);
-    column()->addLayout(middle, 1);
+    m_grid->setLayout(inColumn(Space::None, {m_empty}));
+    addRow({side, {inColumn(Space::Small, {inRow(Space::Normal, {m_up, {m_where, 1}}), {m_grid, 1}}), 1}}, Space::Far);
+    column()->setStretch(column()->count() - 1, 1);
 
-    auto* bottom = new QHBoxLayout;
-    auto* cancel = new QPushButton(state.wording(u"ביטול"_s, u"Cancel"_s), this);
-    setRole(cancel, "secondary");
-    cancel->setObjectName(u"pickerCancel"_s);
-    cancel->setAccessibleName(cancel->text());
-    cancel->setFocusPolicy(Qt::TabFocus);
-    connect(cancel, &QPushButton::clicked, this, [this] { Q_EMIT finished({}); });
-    bottom->addWidget(cancel);
-    bottom->addStretch(1);
-    m_take = new QPushButton(everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
-                                         : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
-                             this);
-    setRole(m_take, "main");
-    m_take->setObjectName(u"pickerTake"_s);
-    m_take->setAccessibleName(m_take->text());
-    m_take->setFocusPolicy(Qt::TabFocus);
-    connect(m_take, &QPushButton::clicked, this, &PicturePicker::take);
-    bottom->addWidget(m_take);
-    column()->addLayout(bottom);
+    QPushButton* cancel =
+        named(u"pickerCancel"_s, "secondary", state.wording(u"ביטול"_s, u"Cancel"_s), [this] { Q_EMIT finished({}); });
+    m_take = named(u"pickerTake"_s, "main",
+                   everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
+                               : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
+                   [this] { take(); });
+    addButtons(cancel, m_take);
 
-    connect(this, &Overlay::escaped, this, [this] { Q_EMIT finished({}); });
+    whenEscaped([this] { Q_EMIT finished({}); });
     m_reader.setInterval(0);
     connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
     setFirstFocus(m_grid);

@@ -9,6 +9,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files)
     : m_window(window)
     , m_state(state)
@@ -43,7 +45,7 @@ void ScreenDialogs::showNext() {
 }
 
 QString ScreenDialogs::closingText() const {
-    return m_state.wording(QStringLiteral("הבנתי"), QStringLiteral("OK"));
+    return m_state.wording(u"הבנתי"_s, u"OK"_s);
 }
 
 QString ScreenDialogs::frontText() const {
@@ -66,8 +68,7 @@ bool ScreenDialogs::ask(const QString& question, const QString& title) {
             return *answer;
     }
     MessagePanel panel(m_window.theme(), &m_window, MessagePanel::Kind::Question, title, question,
-                       {m_state.wording(QStringLiteral("כן"), QStringLiteral("Yes")),
-                        m_state.wording(QStringLiteral("לא"), QStringLiteral("No"))});
+                       {m_state.wording(u"כן"_s, u"Yes"_s), m_state.wording(u"לא"_s, u"No"_s)});
     panel.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     QEventLoop loop;
     bool yes = false;

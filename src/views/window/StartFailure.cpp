@@ -9,20 +9,21 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void showStartFailure(const QString& text) {
-    if (QGuiApplication::platformName() == QStringLiteral("offscreen") ||
-        QGuiApplication::platformName() == QStringLiteral("minimal"))
+    if (QGuiApplication::platformName() == u"offscreen"_s || QGuiApplication::platformName() == u"minimal"_s)
         return;
     const Theme theme(1.0);
     QWidget window;
-    window.setObjectName(QStringLiteral("lumoraWindow"));
+    window.setObjectName(u"lumoraWindow"_s);
     window.setAttribute(Qt::WA_StyledBackground);
-    window.setWindowTitle(QStringLiteral("Lumora"));
+    window.setWindowTitle(u"Lumora"_s);
     window.setStyleSheet(theme.styleSheet());
     window.resize(900, 600);
     MessagePanel panel(theme, &window, MessagePanel::Kind::Message,
-                       QStringLiteral("התוכנה אינה יכולה להתחיל · The program can't start"),
-                       QStringLiteral("\u2066%1\u2069").arg(text), {QStringLiteral("סגור · Close")});
+                       u"התוכנה אינה יכולה להתחיל · The program can't start"_s, u"\u2066%1\u2069"_s.arg(text),
+                       {u"סגור · Close"_s});
     panel.setCardWidth(780);
     QEventLoop loop;
     QObject::connect(&panel, &MessagePanel::answered, &loop, &QEventLoop::quit);
