@@ -74,7 +74,7 @@ QLayout* hatchalaView::makeWords() {
     QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline, m_how});
     for (const QString& icon : {u"pictures"_s, u"printer"_s, u"send"_s}) {
         m_steps.push_back(words("body"));
-        column->addLayout(inRow(Space::Normal, {sign(icon, Sign::Line), {m_steps.back(), 1}}));
+        column->addLayout(inRow(Space::Normal, {sign(icon, IconSize::Line), {m_steps.back(), 1}}));
     }
     QPushButton* prices = button(u"Image11"_s, m_page.Image11, Role::Plain, &hatchala::Image11_Click, u"tag"_s);
     QPushButton* site = button(u"Image5"_s, m_page.Image5, Role::Plain, &hatchala::Image5_Click, u"globe"_s);
@@ -101,7 +101,7 @@ QLayout* hatchalaView::makeSide() {
 QWidget* hatchalaView::makeStage() {
     m_prints = new Prints(this);
     QLabel* head = label(u"Picture3"_s, m_page.Picture3, "muted");
-    head->setMinimumHeight(theme().size(Sign::Line));
+    head->setMinimumHeight(theme().size(IconSize::Line));
     head->setAlignment(Qt::AlignCenter);
     keepPlaceWhenHidden(*head);
     using enum hatchala::Hover;
@@ -122,7 +122,7 @@ QWidget* hatchalaView::makeStage() {
 QWidget* hatchalaView::makeHelp(hatchala::Hover over, const QString& icon) {
     const Card card = makeCard("card", Pad::Wide);
     m_helps.push_back({over, words("large")});
-    card.column->addLayout(inRow(Space::Wide, {sign(icon, Sign::Box), {m_helps.back().text, 1}}));
+    card.column->addLayout(inRow(Space::Wide, {sign(icon, IconSize::Box), {m_helps.back().text, 1}}));
     const auto at = static_cast<std::size_t>(over);
     bind(numbered("Image12", at), card.frame, m_page.Image12[at]);
     return card.frame;
@@ -132,7 +132,7 @@ hatchalaView::Hint hatchalaView::makeHint(const QString& name, const Caption& ca
     QLabel* text = oneLine("smallMuted");
     QHBoxLayout* row = inRow(Space::Small);
     if (!icon.isEmpty())
-        row->addWidget(sign(icon, Sign::Small, Theme::Colour::Muted));
+        row->addWidget(sign(icon, IconSize::Small, Theme::Colour::Muted));
     row->addWidget(text);
     QWidget* box = inBox(row);
     bind(name, box, caption);
@@ -142,7 +142,7 @@ hatchalaView::Hint hatchalaView::makeHint(const QString& name, const Caption& ca
 QWidget* hatchalaView::makeContact() {
     const auto entry = [&](const QString& icon, QLabel* text) {
         text->setWordWrap(false);
-        return inBox(inRow(Space::Small, {sign(icon, Sign::Button), text}));
+        return inBox(inRow(Space::Small, {sign(icon, IconSize::Button), text}));
     };
     m_telephone = entry(u"phone"_s, label(u"Label4Tel"_s, m_page.Label4Tel, "strong"));
     m_mail = entry(u"mail"_s, label(u"Label1"_s, m_page.Label1, "body"));

@@ -24,7 +24,7 @@ void changeRole(QWidget* widget, const char* role) {
 }
 
 void setButtonIcon(QAbstractButton* button, const Theme& theme, const QString& icon, QColor colour) {
-    const int size = theme.size(Sign::Button);
+    const int size = theme.size(IconSize::Button);
     button->setIcon(theme.buttonIcon(icon, size, colour, Theme::Colour::Muted));
     button->setIconSize({size, size});
 }
@@ -100,7 +100,7 @@ QLabel* Maker::oneLine(const char* type) const {
     return label;
 }
 
-QLabel* Maker::sign(const QString& icon, Sign size, QColor colour) const {
+QLabel* Maker::sign(const QString& icon, IconSize size, QColor colour) const {
     auto* label = new QLabel(m_parent);
     label->setPixmap(m_theme.icon(icon, m_theme.size(size), colour));
     return label;

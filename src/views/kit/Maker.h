@@ -61,7 +61,7 @@ public:
 
     QLabel* words(const char* type, const QString& text = {}) const;
     QLabel* oneLine(const char* type) const;
-    QLabel* sign(const QString& icon, Sign size, QColor colour = Theme::Colour::Primary) const;
+    QLabel* sign(const QString& icon, IconSize size, QColor colour = Theme::Colour::Primary) const;
     // A button that no control of a page is bound to.
     QPushButton* plainButton(const QString& name, const char* role, std::function<void()> clicked) const;
 

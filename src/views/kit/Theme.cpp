@@ -31,7 +31,7 @@ int Theme::size(Space space) const {
     return px(pixels[static_cast<int>(space)]);
 }
 
-int Theme::size(Sign sign) const {
+int Theme::size(IconSize sign) const {
     static constexpr int pixels[] = {20, 24, 32, 44, 96};
     return px(pixels[static_cast<int>(sign)]);
 }

@@ -19,7 +19,7 @@ enum class Space { None, Tight, Small, Normal, Wide, Far };
 // The room between the edge of a card and what it holds.
 enum class Pad { Tight, Slim, Normal, Wide };
 // The side of an icon: of a small key, of a button, at a line of words, of a box, of an empty page.
-enum class Sign { Small, Button, Line, Box, Page };
+enum class IconSize { Small, Button, Line, Box, Page };
 
 // The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
 class Theme {
@@ -60,7 +60,7 @@ public:
     int px(double length) const;
 
     int size(Space space) const;
-    int size(Sign sign) const;
+    int size(IconSize sign) const;
     QMargins margins(Pad pad) const;
     int gap() const { return size(Space::Normal); }
     int margin() const { return size(Space::Far); } // of a page

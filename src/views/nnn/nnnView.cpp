@@ -221,7 +221,7 @@ void nnnView::makeBars() {
     QLabel* telephone = label(u"Label4Tel"_s, m_page.Label4Tel, "muted");
     for (QLabel* line : {m_choiceStatus, telephone})
         line->setWordWrap(false);
-    frame().addStatus({m_choiceStatus, sign(u"phone"_s, Sign::Small), telephone});
+    frame().addStatus({m_choiceStatus, sign(u"phone"_s, IconSize::Small), telephone});
     frame().addMainActions({button(u"Command12"_s, m_page.Command12, Role::Main, &nnn::Command12_Click),
                             button(u"Command8"_s, m_page.Command8, Role::Main, &nnn::Command8_Click),
                             button(u"Command6"_s, m_page.Command6, Role::Main, &nnn::Command6_Click),

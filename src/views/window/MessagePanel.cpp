@@ -17,7 +17,7 @@ MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const
     if (!title.isEmpty())
         said->addWidget(words("large", isolated(title)));
     said->addWidget(body);
-    addRow({{sign(kind == Kind::Question ? u"info"_s : u"warning"_s, Sign::Box), 0, Qt::AlignTop}, {said, 1}},
+    addRow({{sign(kind == Kind::Question ? u"info"_s : u"warning"_s, IconSize::Box), 0, Qt::AlignTop}, {said, 1}},
            Space::Wide);
     QHBoxLayout* row = inRow(Space::Normal, {Item::room()});
     for (int i = static_cast<int>(buttons.size()) - 1; i >= 0; --i) {
