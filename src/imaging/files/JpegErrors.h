@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <QSysInfo>
 
 #include <csetjmp>
 #include <cstdio>
@@ -8,6 +9,9 @@
 #include <jpeglib.h>
 
 namespace lumora {
+
+// How libjpeg names the bytes of a Bitmap.
+constexpr J_COLOR_SPACE bitmapColours = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? JCS_EXT_BGRX : JCS_EXT_XRGB;
 
 // libjpeg reports an error by a call that may not return. The jump goes back to guarded(), whose argument therefore may
 // call libjpeg but must own nothing that has a destructor.

@@ -4,8 +4,6 @@
 #include "imaging/drawing/ColourPlanes.h"
 #include "imaging/files/JpegErrors.h"
 
-#include <QSysInfo>
-
 #include <array>
 #include <cerrno>
 #include <utility>
@@ -19,8 +17,6 @@ namespace {
 
 // A progressive file may ask for the whole picture to be gone over again and again; real ones have about ten scans.
 constexpr int maxScans = 200;
-
-constexpr J_COLOR_SPACE bitmapColours = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? JCS_EXT_BGRX : JCS_EXT_XRGB;
 
 // Ink on paper to light. Files with the Adobe mark hold the inks inverted, as light passed by each ink.
 void convertInks(const unsigned char* inks, QRgb* line, int width, bool inverted) {

@@ -2,17 +2,9 @@
 
 #include "imaging/files/JpegErrors.h"
 
-#include <QSysInfo>
-
 #include <algorithm>
 
 namespace lumora {
-
-namespace {
-
-constexpr J_COLOR_SPACE bitmapColours = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? JCS_EXT_BGRX : JCS_EXT_XRGB;
-
-} // namespace
 
 struct JpegWriter::State {
     State() {

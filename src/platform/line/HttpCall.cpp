@@ -18,7 +18,7 @@
 namespace lumora {
 namespace {
 
-Failure failure(Failure::Kind kind, const QString& url, const QString& reason) {
+Failure callFailure(Failure::Kind kind, const QString& url, const QString& reason) {
     return {kind, QStringLiteral("%1: %2").arg(url, reason)};
 }
 
@@ -32,14 +32,14 @@ struct Address {
 Result<Address> addressOf(const QString& url) {
     const QString scheme = QStringLiteral("http://");
     if (!url.startsWith(scheme, Qt::CaseInsensitive))
-        return failure(Failure::Kind::Unsupported, url, QStringLiteral("only http addresses can be called"));
+        return callFailure(Failure::Kind::Unsupported, url, QStringLiteral("only http addresses can be called"));
     const QString rest = url.mid(scheme.size());
     qsizetype hostEnd = 0;
     while (hostEnd < rest.size() && !QStringLiteral("/?#").contains(rest[hostEnd]))
         ++hostEnd;
     Address address{rest.left(hostEnd).toStdString(), HttpTarget(rest.mid(hostEnd))};
     if (address.host.empty())
-        return failure(Failure::Kind::Unsupported, url, QStringLiteral("the address names no host"));
+        return callFailure(Failure::Kind::Unsupported, url, QStringLiteral("the address names no host"));
     return address;
 }
 
@@ -83,20 +83,20 @@ Result<int> call(const QString& url, const char* method, const std::string& vers
             body.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
             received += body.gcount();
             if (body.gcount() > 0 && !sink(bytes.data(), static_cast<std::size_t>(body.gcount())))
-                return failure(Failure::Kind::TooLarge, url, QStringLiteral("the answer could not be taken whole"));
+                return callFailure(Failure::Kind::TooLarge, url, QStringLiteral("the answer could not be taken whole"));
         }
         if (const Poco::Exception* lost = session.networkException())
             lost->rethrow();
         const std::streamsize announced = response.hasContentLength() ? response.getContentLength64() : received;
         if (received < announced)
-            return failure(Failure::Kind::Disconnected, url, QStringLiteral("the answer was cut short"));
+            return callFailure(Failure::Kind::Disconnected, url, QStringLiteral("the answer was cut short"));
         return static_cast<int>(response.getStatus());
     } catch (const Poco::TimeoutException&) {
-        return failure(Failure::Kind::TimedOut, url, QStringLiteral("no answer within the time limit"));
+        return callFailure(Failure::Kind::TimedOut, url, QStringLiteral("no answer within the time limit"));
     } catch (const Poco::Exception& exception) {
-        return failure(Failure::Kind::Disconnected, url, QString::fromStdString(exception.displayText()));
+        return callFailure(Failure::Kind::Disconnected, url, QString::fromStdString(exception.displayText()));
     } catch (const std::exception& exception) {
-        return failure(Failure::Kind::Other, url, QString::fromLocal8Bit(exception.what()));
+        return callFailure(Failure::Kind::Other, url, QString::fromLocal8Bit(exception.what()));
     }
 }
 
