@@ -62,9 +62,9 @@ int main(int argc, char** argv) {
             return 1;
     }
 
-    auto& page = static_cast<RedI&>(chain.load(PageId::RedI));
+    auto& page = chain.load<RedI>();
     const Times opening = timed([&] { page.open(QStringLiteral("C:\\large.jpg")); });
-    if (page.Picture1.isNull())
+    if (page.picture().Picture1.isNull())
         return 1;
     std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", opening.wall, opening.processor);
     // The customer looks for the eye.
@@ -79,12 +79,12 @@ int main(int argc, char** argv) {
         const QPoint at = eye(round);
         page.Picture1_MouseDown(RedI::Button::Left, at);
         page.Picture1_MouseUp(at);
-        while (page.circle().width() != circle)
-            page.Combo1_Change(page.circle().width() < circle ? 0 : 2);
+        while (page.sight().circle().width() != circle)
+            page.Combo1_Change(page.sight().circle().width() < circle ? 0 : 2);
         const Times press = timed([&] { page.Image2_Click(); });
         ours.push_back(press.processor);
         oursWall.push_back(press.wall);
-        if (page.List1.isEmpty()) {
+        if (page.controls().List1.isEmpty()) {
             std::fprintf(stderr, "nothing was corrected\n");
             return 1;
         }
@@ -93,11 +93,11 @@ int main(int argc, char** argv) {
         QStringList changed;
         QImage overview;
         const Times onCopy = timed([&] {
-            Bitmap copy(page.Picture1.image().copy());
+            Bitmap copy(page.picture().Picture1.image().copy());
             const RedEye::Peak peak = RedEye::findPeak(copy, at);
-            changed = RedEye::correct(copy, page.circle(), peak.ratio(), 0);
-            overview =
-                copy.image().scaled(page.Picture3.image().size(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+            changed = RedEye::correct(copy, page.sight().circle(), peak.ratio(), 0);
+            overview = copy.image().scaled(page.picture().Picture3.image().size(), Qt::IgnoreAspectRatio,
+                                           Qt::SmoothTransformation);
         });
         copied.push_back(onCopy.processor);
         if (changed.isEmpty() || overview.isNull())

@@ -4,8 +4,8 @@ namespace lumora {
 
 class Ticker;
 
-// The button of a page on which a finger rests: its ticker runs until it is let go, and a press that ends before the
-// first tick counts as one.
+// The held button of a page. Its ticker runs until the button is let go; a press that ends before the first tick counts
+// as one tick.
 class HeldButton {
 public:
     // Another button that was held is let go.
@@ -14,7 +14,7 @@ public:
     bool isHeld() const { return m_ticker != nullptr; }
     bool holds(const Ticker& ticker) const { return m_ticker == &ticker; }
 
-    // What the handler of a tick asks first. No: the tick was under way when the button was let go.
+    // A tick handler asks this first: false for a tick that was under way when the button was let go.
     bool ticks(const Ticker& ticker);
     void tickOnceIfNone();
 

@@ -70,43 +70,43 @@ protected:
 };
 
 TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
-    surfaces.CipCip = opened(picture("wide.bmp", halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140))));
-    const QImage before = surfaces.CipCip->workPicture().image().copy();
+    surfaces.open(opened(picture("wide.bmp", halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140)))));
+    const QImage before = surfaces.workPicture()->workPicture().image().copy();
     surfaces.Command2_Click();
-    EXPECT_EQ(surfaces.Picture2.image().size(), QSize(400, 200));
-    EXPECT_EQ(surfaces.Image_crop, QRect(50, 25, 300, 150));
-    EXPECT_EQ(surfaces.List1.count(), 61 * 31);
-    EXPECT_EQ(surfaces.List1.item(0), u"020"_s);
-    EXPECT_EQ(surfaces.List3.item(surfaces.List3.lastIndex()), u"140"_s);
-    EXPECT_NEAR(surfaces.levels.gains[0], 255 / 220.2, 1e-4);
-    EXPECT_EQ(surfaces.levels.floors, (ChannelValues{30, 50, 70}));
-    EXPECT_EQ(surfaces.CipCip->workPicture().image(), before);
+    EXPECT_EQ(surfaces.controls().Picture2.image().size(), QSize(400, 200));
+    EXPECT_EQ(surfaces.controls().Image_crop, QRect(50, 25, 300, 150));
+    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 31);
+    EXPECT_EQ(surfaces.controls().List1.item(0), u"020"_s);
+    EXPECT_EQ(surfaces.controls().List3.item(surfaces.controls().List3.lastIndex()), u"140"_s);
+    EXPECT_NEAR(surfaces.controls().levels.gains[0], 255 / 220.2, 1e-4);
+    EXPECT_EQ(surfaces.controls().levels.floors, (ChannelValues{30, 50, 70}));
+    EXPECT_EQ(surfaces.workPicture()->workPicture().image(), before);
 
     surfaces.Command2_Click();
-    EXPECT_EQ(surfaces.List1.count(), 61 * 31) << "the lists start afresh";
+    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 31) << "the lists start afresh";
 }
 
 TEST_F(WorkSurfaces, TurnGreyWithEqualWeights) {
-    surfaces.CipCip = opened(picture("flat.bmp", Bitmap(90, 60, QColor(200, 100, 50))));
+    surfaces.open(opened(picture("flat.bmp", Bitmap(90, 60, QColor(200, 100, 50)))));
     surfaces.Command1_Click();
-    EXPECT_EQ(surfaces.CipCip->workPicture().image().pixelColor(40, 30), QColor(105, 105, 105));
-    surfaces.Picture1 = Bitmap(4, 4, Qt::white);
+    EXPECT_EQ(surfaces.workPicture()->workPicture().image().pixelColor(40, 30), QColor(105, 105, 105));
+    surfaces.openSecond(Bitmap(4, 4, Qt::white));
     surfaces.Picture1Grey_Click();
-    EXPECT_EQ(surfaces.Picture1.image().pixelColor(1, 1), QColor(229, 229, 229));
+    EXPECT_EQ(surfaces.controls().Picture1.image().pixelColor(1, 1), QColor(229, 229, 229));
 }
 
 TEST_F(WorkSurfaces, DoNothingBeforeAPictureIsOpened) {
     surfaces.Command1_Click();
     surfaces.Command2_Click();
     surfaces.Picture1Grey_Click();
-    EXPECT_TRUE(surfaces.List1.isEmpty());
-    EXPECT_TRUE(surfaces.Picture1.isNull());
+    EXPECT_TRUE(surfaces.controls().List1.isEmpty());
+    EXPECT_TRUE(surfaces.controls().Picture1.isNull());
 }
 
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
-    auto& look = static_cast<Form3&>(chain.load(PageId::Form3));
+    auto& look = chain.load<Form3>();
     const QString path = picture("look.bmp", halves(1000, 500, Qt::red, Qt::blue));
-    look.showPicture(path);
+    look.open(path);
     // Red lies left, on top, right, below: a quarter turn clockwise each time, and upright again after four.
     struct Case {
         int angle;
@@ -116,9 +116,9 @@ TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
     for (const Case& c :
          {Case{0, {700, 350}, 0.1, 0.5}, Case{90, {350, 700}, 0.5, 0.1}, Case{180, {700, 350}, 0.9, 0.5},
           Case{270, {350, 700}, 0.5, 0.9}, Case{0, {700, 350}, 0.1, 0.5}}) {
-        EXPECT_EQ(look.angle, c.angle);
-        EXPECT_EQ(look.Picture2Box, c.box);
-        const QImage& shown = look.Picture2.image();
+        EXPECT_EQ(look.controls().angle, c.angle);
+        EXPECT_EQ(look.controls().Picture2Box, c.box);
+        const QImage& shown = look.controls().Picture2.image();
         EXPECT_EQ(shown.width() * c.box.height, shown.height() * c.box.width);
         EXPECT_EQ(shown.pixelColor(static_cast<int>(shown.width() * c.redX), static_cast<int>(shown.height() * c.redY)),
                   QColor(Qt::red))
@@ -127,7 +127,7 @@ TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
     }
     std::filesystem::remove(host(path));
     look.Command2_Click();
-    EXPECT_TRUE(look.Picture2.isNull());
+    EXPECT_TRUE(look.controls().Picture2.isNull());
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages.first().contains(u"look.bmp"_s));
     look.Command3_Click();

@@ -12,8 +12,6 @@
 
 #include <gtest/gtest.h>
 
-#include <functional>
-
 namespace lumora {
 
 inline const QString lying = u"C:\\p\\lying.jpg"_s;
@@ -49,9 +47,9 @@ protected:
 
     // The page, its stores recorded.
     tFrmNew& page() {
-        auto* made = static_cast<tFrmNew*>(chain.find(PageId::tFrmNew));
+        auto* made = chain.find<tFrmNew>();
         if (made == nullptr) {
-            made = static_cast<tFrmNew*>(&chain.load(PageId::tFrmNew));
+            made = &chain.load<tFrmNew>();
             QObject::connect(made, &tFrmNew::stored, [this] { stored += state.edit.EditState; });
         }
         return *made;
@@ -71,21 +69,34 @@ protected:
     QString field(EditRecord::Column column) const {
         return state.edit.EditState.mid(column.position - 1, column.width);
     }
-    QColor middle() { return page().PicPic.image().pixelColor(page().PicPic.width() / 2, page().PicPic.height() / 2); }
-    QColor corner() { return page().PicPic.image().pixelColor(2, 2); }
+    const tFrmNewControls& shown() { return page().controls(); }
+    const QImage& paper() { return shown().PicPic.image(); }
+    QColor middle() { return paper().pixelColor(paper().rect().center()); }
+    QColor corner() { return paper().pixelColor(2, 2); }
 
     // A button held for so many ticks.
-    static void held(const std::function<void()>& down, const std::function<void()>& tick,
-                     const std::function<void()>& up, int ticks) {
-        down();
+    struct Button {
+        void (tFrmNew::*down)();
+        void (tFrmNew::*tick)();
+        void (tFrmNew::*up)();
+    };
+    static constexpr Button right{&tFrmNew::Image135_MouseDown, &tFrmNew::Timer7_Tick, &tFrmNew::Image135_MouseUp};
+    static constexpr Button left{&tFrmNew::Image115_MouseDown, &tFrmNew::Timer7_Tick, &tFrmNew::Image115_MouseUp};
+    static constexpr Button up{&tFrmNew::Image125_MouseDown, &tFrmNew::Timer8_Tick, &tFrmNew::Image125_MouseUp};
+    static constexpr Button down{&tFrmNew::Image145_MouseDown, &tFrmNew::Timer8_Tick, &tFrmNew::Image145_MouseUp};
+    static constexpr Button turnRight{&tFrmNew::Image16_MouseDown, &tFrmNew::Timer6_Tick, &tFrmNew::Image16_MouseUp};
+    static constexpr Button turnLeft{&tFrmNew::Image17_MouseDown, &tFrmNew::Timer6_Tick, &tFrmNew::Image17_MouseUp};
+    void hold(const Button& button, int ticks) {
+        (page().*button.down)();
         for (int i = 0; i < ticks; ++i)
-            tick();
-        up();
+            (page().*button.tick)();
+        (page().*button.up)();
     }
     void holdImage2(int index, int ticks) {
-        const bool zoom = index < 2;
-        held([&] { page().Image2_MouseDown(index); }, [&] { zoom ? page().Timer2_Tick() : page().Timer3_Tick(); },
-             [&] { page().Image2_MouseUp(index); }, ticks);
+        page().Image2_MouseDown(index);
+        for (int i = 0; i < ticks; ++i)
+            index < 2 ? page().Timer2_Tick() : page().Timer3_Tick();
+        page().Image2_MouseUp(index);
     }
 
     QStringList stored;

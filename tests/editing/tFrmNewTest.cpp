@@ -2,21 +2,23 @@
 
 #include "editing/render/EditedPicture.h"
 
+#include <functional>
+
 namespace lumora {
 namespace {
 
 TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
     page();
     EXPECT_TRUE(stored.isEmpty());
-    tFrmNew& editor = open(lying);
+    open(lying);
     EXPECT_EQ(state.edit.EditState, LeftField(u"1   1   1   180100225 150 0  0  000000000000          "
                                               "8 0 0 0 0 ddd       0  0  0  0  0  0  0 0 "_s,
                                               200));
-    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
-    EXPECT_EQ(editor.PicPic.width(), 450);
+    EXPECT_EQ(shown().PicPicSize, (PictureSize{450, 300}));
+    EXPECT_EQ(paper().width(), 450);
     EXPECT_GT(middle().red(), 240);
-    EXPECT_TRUE(editor.Picture3.visible);
-    EXPECT_FALSE(editor.Image19.visible);
+    EXPECT_TRUE(shown().Picture3.visible);
+    EXPECT_FALSE(shown().Image19.visible);
     EXPECT_EQ(*readPictureSize(host(u"C:\\2000lumora\\0.bmp"_s)), (PictureSize{500, 375}));
 
     // 780 is a position, 781 is none.
@@ -28,37 +30,22 @@ TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
 }
 
 TEST_F(TheEditor, countsTheTicksOfItsHeldButtonsIntoTheRecord) {
-    tFrmNew& editor = open(lying);
+    open(lying);
     holdImage2(0, 25);
-    held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 15);
-    held([&] { editor.Image135_MouseDown(); }, [&] { editor.Timer7_Tick(); }, [&] { editor.Image135_MouseUp(); }, 10);
-    held([&] { editor.Image125_MouseDown(); }, [&] { editor.Timer8_Tick(); }, [&] { editor.Image125_MouseUp(); }, 5);
+    hold(turnRight, 15);
+    hold(right, 10);
+    hold(up, 5);
     EXPECT_EQ(stored.last().mid(12, 14), u"195150245 140 "_s);
 
     chain.unload(PageId::tFrmNew);
     state.shemot.ppr = u"13/18"_s;
     tFrmNew& second = open(standing);
-    EXPECT_EQ(second.PicPicSize, (PictureSize{300, 415}));
+    EXPECT_EQ(shown().PicPicSize, (PictureSize{300, 415}));
     holdImage2(1, 10);
     second.Image15_Click();
-    held([&] { second.Image115_MouseDown(); }, [&] { second.Timer7_Tick(); }, [&] { second.Image115_MouseUp(); }, 10);
-    held([&] { second.Image145_MouseDown(); }, [&] { second.Timer8_Tick(); }, [&] { second.Image145_MouseUp(); }, 5);
+    hold(left, 10);
+    hold(down, 5);
     EXPECT_EQ(stored.last().mid(12, 14), u"27080 130 217 "_s);
-}
-
-TEST_F(TheEditor, storesAGainByItsFirstFourCharacters) {
-    tFrmNew& editor = open(lying);
-    holdImage2(3, 3);
-    EXPECT_EQ(stored.last().left(12), u"0.870.870.87"_s);
-    open(lying);
-    holdImage2(4, 5);
-    EXPECT_EQ(stored.last().left(12), u"1.2 1.2 1.2 "_s);
-    editor.Image2_Click(6);
-    EXPECT_EQ(stored.last().left(12), u"1.261.2 1.14"_s);
-    editor.Image2_Click(8);
-    EXPECT_EQ(stored.last().left(12), u"1.2 1.2 1.2 "_s);
-    editor.Image2_Click(10);
-    EXPECT_EQ(stored.last().left(12), u"1.141.2 1.26"_s);
 }
 
 TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
@@ -67,7 +54,7 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     editor.Timer2_Tick();
     editor.Timer2_Tick();
     EXPECT_EQ(state.edit.ZoomPercent, 104);
-    EXPECT_EQ(editor.Label11.text, u"104"_s);
+    EXPECT_EQ(shown().Label11.text, u"104"_s);
     EXPECT_EQ(field(EditRecord::ZoomPercent), u"100"_s);
     EXPECT_TRUE(stored.isEmpty());
     editor.Image2_MouseUp(0);
@@ -108,42 +95,31 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     EXPECT_EQ(field(EditRecord::TextX), u"103"_s);
 }
 
-TEST_F(TheEditor, holdsItsNumbersWithinTheirRanges) {
+TEST_F(TheEditor, takesTheStepsOfItsClickedButtonsIntoTheRecord) {
     tFrmNew& editor = open(lying);
-    holdImage2(0, 80);
-    EXPECT_EQ(state.edit.ZoomPercent, 210);
-    holdImage2(1, 120);
-    EXPECT_EQ(state.edit.ZoomPercent, 40);
-    editor.VScrollZ_Change(500);
-    EXPECT_EQ(editor.VScrollZ, 210);
-    EXPECT_EQ(state.edit.ZoomPercent, 40);
-
-    state.edit.RotationCode = 450;
-    editor.Image15_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), u"540"_s);
-    state.edit.RotationCode = 500;
-    editor.Image15_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), u"230"_s);
-    editor.Image18_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), u"500"_s);
-    state.edit.RotationCode = 270;
-    editor.Image18_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), u"180"_s);
-    state.edit.RotationCode = -32768;
-    held([&] { editor.Image17_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image17_MouseUp(); }, 1);
-    EXPECT_EQ(state.edit.RotationCode, -32768);
-    state.edit.RotationCode = 540;
-    held([&] { editor.Image16_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image16_MouseUp(); }, 1);
-    EXPECT_EQ(field(EditRecord::RotationCode), u"180"_s);
-    held([&] { editor.Image17_MouseDown(); }, [&] { editor.Timer6_Tick(); }, [&] { editor.Image17_MouseUp(); }, 3);
-    EXPECT_EQ(field(EditRecord::RotationCode), u"177"_s);
-    editor.Image27_Click();
-    EXPECT_EQ(field(EditRecord::RotationCode), u"180"_s);
-
-    state.edit.PanX = 32767;
+    struct Case {
+        std::function<void()> press;
+        EditRecord::Column column;
+        const char* value;
+    };
+    for (const Case& c : {Case{[&] { editor.Image15_Click(); }, EditRecord::RotationCode, "270"},
+                          Case{[&] { editor.Image18_Click(); }, EditRecord::RotationCode, "180"},
+                          Case{[&] { hold(turnLeft, 3); }, EditRecord::RotationCode, "177"},
+                          Case{[&] { editor.Image27_Click(); }, EditRecord::RotationCode, "180"},
+                          Case{[&] { holdImage2(3, 3); }, EditRecord::GainG, "0.87"},
+                          Case{[&] { holdImage2(4, 3); }, EditRecord::GainG, "0.99"},
+                          Case{[&] { editor.Image2_Click(6); }, EditRecord::GainR, "1.05"},
+                          Case{[&] { editor.Image2_Click(8); }, EditRecord::GainR, "0.99"},
+                          Case{[&] { editor.Image2_Click(10); }, EditRecord::GainB, "1.05"},
+                          Case{[&] { holdImage2(0, 80); }, EditRecord::ZoomPercent, "210"},
+                          Case{[&] { holdImage2(1, 120); }, EditRecord::ZoomPercent, "40 "},
+                          Case{[&] { editor.VScrollZ_Change(500); }, EditRecord::ZoomPercent, "40 "}}) {
+        c.press();
+        EXPECT_EQ(field(c.column), QString::fromLatin1(c.value));
+    }
+    EXPECT_EQ(shown().VScrollZ, tFrmNewControls::VScrollZMax);
     open(lying, recordWith(EditRecord::PanX, u"780"_s).replace(22, 4, u"-999"_s));
-    state.edit.PanY = -999;
-    held([&] { page().Image125_MouseDown(); }, [&] { page().Timer8_Tick(); }, [&] { page().Image125_MouseUp(); }, 1);
+    hold(up, 1);
     EXPECT_EQ(state.edit.PanY, -1001);
     EXPECT_EQ(field(EditRecord::PanY), u"-100"_s);
 }
@@ -151,11 +127,11 @@ TEST_F(TheEditor, holdsItsNumbersWithinTheirRanges) {
 TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
     tFrmNew& editor = open(lying);
     editor.Image13_MouseMove();
-    EXPECT_TRUE(editor.Frame3.visible);
+    EXPECT_TRUE(shown().Frame3.visible);
     editor.PicPic_MouseDown({100, 100});
     for (int i = 0; i < 3; ++i)
         editor.PicPic_MouseMove({107, 100 - 13.0 / 6});
-    EXPECT_FALSE(editor.Frame3.visible);
+    EXPECT_FALSE(shown().Frame3.visible);
     EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
     editor.PicPic_MouseUp();
     editor.PicPic_MouseMove({300, 300});
@@ -174,9 +150,9 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
     tFrmNew& editor = open(lying);
     editor.Image2_MouseDown(0);
     editor.Timer2_Tick();
-    EXPECT_EQ(editor.sunkImage2, 0);
+    EXPECT_EQ(shown().sunkImage2, 0);
     editor.stopHolds();
-    EXPECT_EQ(editor.sunkImage2, -1);
+    EXPECT_EQ(shown().sunkImage2, -1);
     ASSERT_EQ(stored.size(), 1);
     EXPECT_EQ(stored[0].mid(15, 3), u"102"_s);
     editor.Timer2_Tick(); // one that was under way
@@ -212,23 +188,16 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
 
 TEST_F(TheEditor, greysThePictureOnceWhateverTonesFollow) {
     tFrmNew& editor = open(lying);
-    struct Case {
-        void (tFrmNew::*press)();
-        QColor colour;
-        const char* gains;
-    };
-    const std::array<Case, 4> cases = {Case{&tFrmNew::Image11_Click, QColor(99, 76, 60), "1.3 1   0.8 "},
-                                       Case{&tFrmNew::Image4_Click, QColor(76, 76, 76), "1   1   1   "},
-                                       Case{&tFrmNew::Image12_Click, QColor(76, 76, 99), "1   1   1.3 "},
-                                       Case{&tFrmNew::Image9_Click, QColor(76, 99, 76), "1   1.3 1   "}};
     const auto near = [](QColor a, QColor b) {
         return std::abs(a.red() - b.red()) < 4 && std::abs(a.green() - b.green()) < 4 &&
                std::abs(a.blue() - b.blue()) < 4;
     };
-    for (const Case& c : cases) {
-        (editor.*c.press)();
-        EXPECT_TRUE(near(middle(), c.colour)) << c.gains;
-        EXPECT_EQ(stored.last().left(12), QString::fromLatin1(c.gains));
+    for (const auto& [press, colour] :
+         {std::pair(&tFrmNew::Image11_Click, QColor(99, 76, 60)), std::pair(&tFrmNew::Image4_Click, QColor(76, 76, 76)),
+          std::pair(&tFrmNew::Image12_Click, QColor(76, 76, 99)),
+          std::pair(&tFrmNew::Image9_Click, QColor(76, 99, 76))}) {
+        (editor.*press)();
+        EXPECT_TRUE(near(middle(), colour)) << qPrintable(colour.name());
     }
     const QString sepia = recordWith(EditRecord::ToneFlag, u"1"_s).replace(0, 4, u"1.3 "_s);
     open(lying, sepia);
@@ -251,9 +220,9 @@ TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
     editor.Image15_Click();
     holdImage2(0, 10);
     editor.Command10_Click(); // 13/18, from the next load on
-    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 300}));
+    EXPECT_EQ(shown().PicPicSize, (PictureSize{450, 300}));
     editor.Image2_Click(5);
-    EXPECT_EQ(editor.PicPicSize, (PictureSize{450, 325}));
+    EXPECT_EQ(shown().PicPicSize, (PictureSize{450, 325}));
     EXPECT_EQ(stored.last().left(44), u"1   1   1   180100225 162 0  0  017000RED000"_s);
     EXPECT_EQ(field(EditRecord::TextBody).trimmed(), u"Dana"_s);
     EXPECT_GT(middle().blue(), 240);
@@ -278,7 +247,7 @@ TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
     tFrmNew& editor = open(u"C:\\p\\bad.jpg"_s);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_FALSE(editor.pictureOpen());
-    EXPECT_TRUE(editor.PicPic.isNull());
+    EXPECT_TRUE(paper().isNull());
     for (int index = 0; index < 11; ++index) {
         editor.Image2_Click(index);
         editor.Image2_MouseDown(index);
@@ -323,34 +292,7 @@ TEST_F(TheEditor, takesThePaperFromTheOrderAndPassesOverWhatIsNoSize) {
     for (const auto& [paper, height] : {std::pair(u"30/40"_s, 337), std::pair(u"zz/zz"_s, 300)}) {
         chain.unload(PageId::tFrmNew);
         state.shemot.ppr = paper;
-        EXPECT_EQ(open(lying).PicPicSize, (PictureSize{450, height}));
-    }
-}
-
-TEST_F(TheEditor, placesTheCaptionsBoxAndFindsTheAnchorBack) {
-    EditFields fields;
-    fields.TextX = 200;
-    fields.TextY = 150;
-    fields.TextFontSize = 24;
-    fields.TextBody = u"twelve signs"_s;
-    const double width = TextLabelPlace::boxOf(fields).width;
-    EXPECT_NEAR(width, 12 * 12, 24);
-    EXPECT_EQ(TextLabelPlace::blanks(fields).size(), 24);
-    const double tall = 3 + 25 * 12;
-    struct Case {
-        std::int16_t vertical, align;
-        double left, top;
-        QPoint back;
-    };
-    for (const Case& c : {Case{0, 0, 200, 150, {200, 150}}, Case{0, 1, 200 - width / 2, 150, {200, 150}},
-                          Case{0, 2, 200 - width, 150, {203, 150}}, Case{3, 0, 165, 150, {203, 150}},
-                          Case{3, 1, 165, 150 - tall / 2, {200, 150}}, Case{3, 2, 165, 150 - tall, {200, 150}}}) {
-        fields.TextVertical = c.vertical;
-        fields.TextAlign = c.align;
-        const TextLabelBox box = TextLabelPlace::boxOf(fields);
-        EXPECT_NEAR(box.left, c.left, 1e-9);
-        EXPECT_NEAR(box.top, c.top, 1e-9);
-        EXPECT_EQ(TextLabelPlace::anchorOf(box, fields), c.back) << c.vertical << ' ' << c.align;
+        EXPECT_EQ(open(lying).controls().PicPicSize, (PictureSize{450, height}));
     }
 }
 
@@ -358,9 +300,9 @@ TEST_F(TheEditor, beginsACaptionAndHandsItToTheKeyboard) {
     tFrmNew& editor = open(lying);
     editor.Command8_Click();
     EXPECT_EQ(chain.front()->id(), PageId::mikledet);
-    EXPECT_TRUE(editor.Labeltext.visible);
+    EXPECT_TRUE(shown().Labeltext.visible);
     EXPECT_EQ(state.edit.TextFontSize, 24);
-    EXPECT_TRUE(static_cast<mikledet&>(*chain.front()).Check4.checked);
+    EXPECT_TRUE(chain.find<mikledet>()->controls().Check4.checked);
     state.edit.TextBody = u"Dana"_s;
     editor.Command11_Click();
     EXPECT_EQ(stored.last().mid(54, 8), u"240 0 0 "_s);
@@ -374,22 +316,22 @@ TEST_F(TheEditor, beginsACaptionAndHandsItToTheKeyboard) {
 TEST_F(TheEditor, showsCropMarkersThatStayAParallelogramAndCutNothing) {
     using Corner = CropFrame::Corner;
     tFrmNew& editor = open(lying);
-    const QImage before = editor.PicPic.image();
+    const QImage before = paper();
     editor.Command14_Click();
-    EXPECT_EQ(editor.crop.marker(Corner::Picture14), QPoint(450, 300));
+    EXPECT_EQ(shown().crop.marker(Corner::Picture14), QPoint(450, 300));
     editor.CropHandle_MouseDown(Corner::Picture10, {450, 0});
     editor.CropHandle_MouseMove({450 - 130, 26});
     editor.CropHandle_MouseUp();
-    EXPECT_EQ(editor.crop.marker(Corner::Picture10), QPoint(440, 2));
-    EXPECT_EQ(editor.crop.marker(Corner::Picture14), QPoint(440, 302));
+    EXPECT_EQ(shown().crop.marker(Corner::Picture10), QPoint(440, 2));
+    EXPECT_EQ(shown().crop.marker(Corner::Picture14), QPoint(440, 302));
     editor.Command13_Click();
-    const QPoint inset = editor.crop.marker(Corner::Picture11);
+    const QPoint inset = shown().crop.marker(Corner::Picture11);
     editor.Command16_Click();
-    EXPECT_LT(editor.crop.marker(Corner::Picture11).x(), inset.x());
+    EXPECT_LT(shown().crop.marker(Corner::Picture11).x(), inset.x());
     for (int i = 0; i < 100; ++i)
         editor.Command15_Click();
-    EXPECT_LT(editor.crop.marker(Corner::Picture11).y(), editor.crop.marker(Corner::Picture14).y());
-    EXPECT_EQ(editor.PicPic.image(), before);
+    EXPECT_LT(shown().crop.marker(Corner::Picture11).y(), shown().crop.marker(Corner::Picture14).y());
+    EXPECT_EQ(paper(), before);
     EXPECT_TRUE(stored.isEmpty());
 }
 
@@ -404,25 +346,25 @@ TEST_F(TheEditor, tellsOnceThatTheWorkPictureCannotBeWritten) {
 TEST_F(TheEditor, keepsTheSmallViewInLogicalPixelsHoweverSharpTheScreen) {
     page().setPreviewScale(2);
     tFrmNew& editor = open(lying);
-    EXPECT_EQ(editor.PicPic.width(), 900);
+    EXPECT_EQ(paper().width(), 900);
     editor.Image15_Click();
     Result<EditedPreview> expected = EditedPreview::open(host(lying), {10, 15}, 100, EditedPreview::Tone::Colour);
     ASSERT_TRUE(expected);
     EXPECT_EQ(editor.takeSmallView().image(), expected->render(state.edit, std::nullopt).image());
     EXPECT_TRUE(editor.takeSmallView().isNull());
     editor.setPreviewScale(1);
-    EXPECT_EQ(editor.PicPic.width(), 450);
+    EXPECT_EQ(paper().width(), 450);
 }
 
 TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
     open(lying);
     page().Command6_Click();
     EXPECT_EQ(stored.last().mid(41, 3), u"111"_s);
-    auto& surfaces = static_cast<BigPics&>(chain.load(PageId::BigPics));
-    EXPECT_FALSE(surfaces.List1.isEmpty());
-    surfaces.List1.clear();
-    open(lying, state.edit.EditState);
-    EXPECT_FALSE(surfaces.List1.isEmpty());
+    const QString measured = state.edit.EditState;
+    auto& surfaces = chain.load<BigPics>();
+    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 46);
+    open(standing, measured);
+    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 81) << "measured anew";
 }
 
 TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {

@@ -40,7 +40,7 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
     };
     for (int key = 0; key < KeyLayout::firstSymbol; ++key)
         press(key);
-    EXPECT_EQ(page.Text1.text.size(), KeyLayout::firstSymbol);
+    EXPECT_EQ(page.controls().Text1.text.size(), KeyLayout::firstSymbol);
     look(walk, u"31-keyboard-text"_s);
     walk.press(u"mikledet"_s, u"Command5"_s);
     look(walk, u"32-keyboard-symbols"_s);
@@ -48,7 +48,7 @@ TEST_P(CaptionKeyboard, FitsBelowThePictureWithEveryKeyInReach) {
         press(key);
         EXPECT_TRUE(finder.press(u"mikledet"_s, u"Command5"_s).ok());
     }
-    EXPECT_EQ(page.Text1.text.size(), 60);
+    EXPECT_EQ(page.controls().Text1.text.size(), 60);
 }
 
 TEST_P(CaptionKeyboard, StandsBelowThePictureThatItWritesOn) {
@@ -79,9 +79,9 @@ TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     walk.type(u"mikledet"_s, u"Text1"_s, u"a\nb"_s);
     EXPECT_EQ(state.edit.TextBody, u"a\r\nb"_s) << "typing replaces";
     walk.press(u"mikledet"_s, u"leter(%1)"_s.arg(KeyLayout::firstDigit + 5));
-    EXPECT_EQ(page.Text1.text, u"a\r\nb5"_s);
+    EXPECT_EQ(page.controls().Text1.text, u"a\r\nb5"_s);
     QTest::keyClick(walk.program().window().frontView(), Qt::Key_Backspace);
-    EXPECT_EQ(page.Text1.text, u"a\r\nb"_s) << "wherever the keyboard is";
+    EXPECT_EQ(page.controls().Text1.text, u"a\r\nb"_s) << "wherever the keyboard is";
 
     walk.press(u"mikledet"_s, u"Image1"_s);
     EXPECT_EQ(state.edit.TextFontSize, 26);
@@ -89,7 +89,7 @@ TEST(CaptionPanel, TakesARealKeyboardTheTapOfAHeldButtonAndAFieldOfThePalette) {
     walk.press(u"mikledet"_s, u"Image15(2)"_s);
     EXPECT_EQ(state.edit.TextY, y - 2);
 
-    const QImage& palette = page.Picture18Image.image();
+    const QImage& palette = page.controls().Picture18Image.image();
     for (const double percent : {3.0, 40.0, 97.0}) {
         const ControlFinder finder(walk.program().window());
         EXPECT_TRUE(finder.pressAt(u"mikledet"_s, u"Picture18"_s, {percent, 50}).ok());

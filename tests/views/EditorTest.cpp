@@ -88,7 +88,7 @@ TEST(EditorByMouse, HoldsDragsAndTaps) {
     const auto record = [&] { return walk.page<kyoskNew>(PageId::kyoskNew).List1.item(0).mid(9, 200); };
 
     walk.press(editor, u"Image2(0)"_s);
-    EXPECT_EQ(page.Label11.text, u"102"_s) << "a tap is one step";
+    EXPECT_EQ(page.controls().Label11.text, u"102"_s) << "a tap is one step";
     EXPECT_EQ(edit.ZoomPercent, 102);
     EXPECT_EQ(record().mid(15, 3), u"102"_s) << "kept in the basket when let go";
     walk.press(editor, u"Image2(4)"_s);
@@ -100,11 +100,11 @@ TEST(EditorByMouse, HoldsDragsAndTaps) {
     ASSERT_TRUE(held.ok());
     walk.settle(420);
     finder.letGo(*held);
-    const int after = page.Label11.text.toInt();
+    const int after = page.controls().Label11.text.toInt();
     EXPECT_GE(after, 106) << "it goes on while it is held";
     EXPECT_LE(after, 120);
     walk.settle(200);
-    EXPECT_EQ(page.Label11.text.toInt(), after) << "and stops when let go";
+    EXPECT_EQ(page.controls().Label11.text.toInt(), after) << "and stops when let go";
 
     // Held while the page goes from under the finger.
     const Result<ControlFinder::Held> lost = finder.hold(editor, u"Image135"_s);
@@ -116,7 +116,7 @@ TEST(EditorByMouse, HoldsDragsAndTaps) {
     EXPECT_EQ(edit.PanX, pan);
     walk.press(u"kyoskNew"_s, u"Picture1(0)"_s);
     walk.waitFor(editor);
-    EXPECT_EQ(page.Label11.text.toInt(), after) << "as it was left";
+    EXPECT_EQ(page.controls().Label11.text.toInt(), after) << "as it was left";
 
     // Twenty moves of 2 percent of the paper: their distances from the press, a thirteenth of each.
     const int before = edit.PanX;
@@ -156,7 +156,7 @@ TEST(EditorByKeyboard, ReachesEachToolAndLeavesByEsc) {
     auto& page = walk.page<tFrmNew>(PageId::tFrmNew);
     walk.program().window().findChild<QWidget*>(u"Image2(0)"_s)->setFocus();
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
-    EXPECT_EQ(page.Label11.text, u"102"_s);
+    EXPECT_EQ(page.controls().Label11.text, u"102"_s);
     walk.program().window().findChild<QWidget*>(u"Combo2"_s)->setFocus();
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Right);
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Left);
@@ -165,7 +165,7 @@ TEST(EditorByKeyboard, ReachesEachToolAndLeavesByEsc) {
     page.Image13_MouseMove();
     walk.settle();
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
-    EXPECT_FALSE(page.Frame3.visible) << "Esc closes a panel first";
+    EXPECT_FALSE(page.controls().Frame3.visible) << "Esc closes a panel first";
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
     walk.waitFor(u"kyoskNew"_s);
 }

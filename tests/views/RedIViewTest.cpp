@@ -57,7 +57,7 @@ protected:
         const QString path = walk.pictureFolder() + u"\\IMG_0001.jpg"_s;
         EXPECT_TRUE(saveJpeg(flashPhotograph(), *walk.program().platform().files.drives().toHost(path), 95).ok());
         walk.program().state().edit.PicturePath = path;
-        static_cast<RedI&>(walk.program().chain().load(PageId::RedI)).open(path);
+        walk.program().chain().load<RedI>().open(path);
         walk.waitFor(u"RedI"_s);
     }
     RedI& page() { return walk.page<RedI>(PageId::RedI); }
@@ -84,37 +84,37 @@ TEST_P(RedEyeView, LeadsFromTheEyeToTheCorrectionWithEveryControlInReach) {
     look(u"redi-1-find"_s);
     EXPECT_FALSE(*ControlFinder(walk.program().window()).enabled(u"RedI"_s, u"Image2"_s));
     pressOverview(eye);
-    EXPECT_LT((QPoint(page().RedSearchX, page().RedSearchY) - eye).manhattanLength(), 24);
+    EXPECT_LT((QPoint(page().sight().RedSearchX, page().sight().RedSearchY) - eye).manhattanLength(), 24);
     look(u"redi-2-place"_s);
 
     // A tap in the middle of the picture picks the pixel that lies there.
-    const QPoint before(page().RedSearchX, page().RedSearchY);
+    const QPoint before(page().sight().RedSearchX, page().sight().RedSearchY);
     QWidget& canvas = control(u"Picture1"_s);
     QTest::mouseClick(&canvas, Qt::LeftButton, {}, canvas.rect().center());
-    EXPECT_LE((QPoint(page().RedSearchX, page().RedSearchY) - before).manhattanLength(), 2);
-    while (page().RedSearchX < eye.x())
+    EXPECT_LE((QPoint(page().sight().RedSearchX, page().sight().RedSearchY) - before).manhattanLength(), 2);
+    while (page().sight().RedSearchX < eye.x())
         press(u"Image15"_s); // a tap is one step
-    while (page().RedSearchX > eye.x() + 1)
+    while (page().sight().RedSearchX > eye.x() + 1)
         press(u"Image14"_s);
-    while (page().RedSearchY < eye.y())
+    while (page().sight().RedSearchY < eye.y())
         press(u"Image13"_s);
-    while (page().RedSearchY > eye.y() + 1)
+    while (page().sight().RedSearchY > eye.y() + 1)
         press(u"Image12"_s);
-    const int size = page().circle().width();
+    const int size = page().sight().circle().width();
     press(u"Image11"_s);
-    EXPECT_EQ(page().circle().width(), size + 1);
+    EXPECT_EQ(page().sight().circle().width(), size + 1);
     press(u"Image10"_s);
-    EXPECT_EQ(page().circle().width(), size);
+    EXPECT_EQ(page().sight().circle().width(), size);
     QWheelEvent turn(canvas.rect().center(), canvas.mapToGlobal(canvas.rect().center()), {}, {0, 120}, Qt::NoButton,
                      Qt::NoModifier, Qt::NoScrollPhase, false);
     for (int i = 0; i < 8; ++i)
         QCoreApplication::sendEvent(&canvas, &turn);
-    EXPECT_EQ(page().circle().width(), size + 16);
+    EXPECT_EQ(page().sight().circle().width(), size + 16);
     look(u"redi-3-aim"_s);
 
     press(u"Image2"_s);
-    EXPECT_TRUE(page().RedChanged);
-    EXPECT_LT(RedEye::redness(page().Picture1.image().pixel(eye)), 20);
+    EXPECT_TRUE(page().picture().RedChanged);
+    EXPECT_LT(RedEye::redness(page().picture().Picture1.image().pixel(eye)), 20);
     look(u"redi-4-corrected"_s);
     press(u"Frame6"_s);
     press(u"Image6"_s);
@@ -128,7 +128,7 @@ TEST_P(RedEyeView, LeadsFromTheEyeToTheCorrectionWithEveryControlInReach) {
     look(u"redi-7-help"_s);
     press(u"CommandHelpClose"_s);
     press(u"Image7"_s);
-    EXPECT_GT(RedEye::redness(page().Picture1.image().pixel(eye)), 200);
+    EXPECT_GT(RedEye::redness(page().picture().Picture1.image().pixel(eye)), 200);
 }
 
 TEST_P(RedEyeHands, OpensItsMenuByTheRightButtonALongPressAndAButton) {
@@ -139,40 +139,40 @@ TEST_P(RedEyeHands, OpensItsMenuByTheRightButtonALongPressAndAButton) {
     walk.settle();
     press(u"CommandMenuClose"_s);
 
-    const QPoint before(page().RedSearchX, page().RedSearchY);
+    const QPoint before(page().sight().RedSearchX, page().sight().RedSearchY);
     QTest::mousePress(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
     walk.settle(750);
-    EXPECT_TRUE(page().kofez.visible);
+    EXPECT_TRUE(page().controls().kofez.visible);
     QTest::mouseRelease(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
-    EXPECT_EQ(QPoint(page().RedSearchX, page().RedSearchY), before); // it was no pick
+    EXPECT_EQ(QPoint(page().sight().RedSearchX, page().sight().RedSearchY), before); // it was no pick
     press(u"Memokad"_s);
 
     for (const QString& item : {u"Bsisi"_s, u"amok2"_s, u"amok3"_s, u"amok4"_s, u"amok5"_s, u"amok"_s, u"Command3"_s}) {
         press(u"CommandMenu"_s);
         press(item);
-        EXPECT_FALSE(page().kofez.visible) << qPrintable(item);
-        EXPECT_TRUE(page().RedChanged) << qPrintable(item);
+        EXPECT_FALSE(page().controls().kofez.visible) << qPrintable(item);
+        EXPECT_TRUE(page().picture().RedChanged) << qPrintable(item);
         press(u"CommandMenu"_s);
         press(u"Rstor"_s);
-        EXPECT_FALSE(page().RedChanged) << qPrintable(item);
+        EXPECT_FALSE(page().picture().RedChanged) << qPrintable(item);
     }
 }
 
 TEST_P(RedEyeHands, FollowsADragAndStopsAHoldWhenThePointerGoes) {
     pressOverview(eye);
-    const double left = page().Picture1Left;
+    const double left = page().sight().Picture1Left;
     const Result<void> dragged =
         ControlFinder(walk.program().window()).drag(u"RedI"_s, u"Picture1"_s, {60, 60}, {40, 60});
     ASSERT_TRUE(dragged.ok()) << qPrintable(dragged.failure().message);
-    EXPECT_LT(page().Picture1Left, left - 50);
+    EXPECT_LT(page().sight().Picture1Left, left - 50);
     QWidget& right = control(u"Image15"_s);
     QTest::mousePress(&right, Qt::LeftButton);
-    EXPECT_TRUE(page().Timer5.running());
-    const int x = page().RedSearchX;
+    EXPECT_TRUE(page().holds());
+    const int x = page().sight().RedSearchX;
     walk.settle(350);
-    EXPECT_GE(page().RedSearchX, x + 4);
+    EXPECT_GE(page().sight().RedSearchX, x + 4);
     QTest::mouseRelease(&right, Qt::LeftButton);
-    EXPECT_FALSE(page().Timer5.running());
+    EXPECT_FALSE(page().holds());
     press(u"Image9"_s);
     walk.settle();
     EXPECT_FALSE(walk.program().chain().find(PageId::RedI));
@@ -184,13 +184,13 @@ TEST_P(RedEyeHands, GivesTheLabsOperatorTheBarAndTheReadings) {
     pressOverview(eye);
     press(u"Command13"_s);
     press(u"Command6"_s);
-    EXPECT_GT(page().RedPeakValue, 200);
+    EXPECT_GT(page().picture().RedPeakValue, 200);
     press(u"Image2"_s);
     control(u"HScroll1"_s).setFocus();
     QTest::keyClick(&control(u"HScroll1"_s), Qt::Key_Home);
     QTest::keyClick(&control(u"HScroll1"_s), Qt::Key_PageUp);
-    EXPECT_GT(page().RedFixLevel, 0);
-    EXPECT_EQ(page().RedFixLevel, 10 * page().HScroll1);
+    EXPECT_GT(page().picture().RedFixLevel, 0);
+    EXPECT_EQ(page().picture().RedFixLevel, 10 * page().controls().HScroll1);
     look(u"redi-8-operator"_s);
 }
 

@@ -200,9 +200,7 @@ bool B3::buildOrderSheet() {
         return false;
     Picture5Image = sheet.bitmap();
     Picture5.visible = true;
-    auto& save = m_chain.load<gdisave>();
-    save.PicPic = Picture5Image;
-    save.Command6_Click();
+    m_chain.load<gdisave>().saveOrderSheet(Picture5Image);
     return true;
 }
 

@@ -1,14 +1,11 @@
 #include "editing/caption/mikledet.h"
 
-#include "common/FixedText.h"
 #include "editing/editor/tFrmNew.h"
 #include "order/EditRecord.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-
-#include <algorithm>
 
 namespace lumora {
 
@@ -18,7 +15,6 @@ namespace {
 
 constexpr int moveMilliseconds = 20;
 constexpr int sizeMilliseconds = 4;
-constexpr std::int16_t step = 2;
 constexpr int paletteField = 46; // pixels a side: a fingertip
 
 // Full colours that print as they look. The first after white is the one a new caption has.
@@ -37,12 +33,12 @@ Bitmap palette() {
 } // namespace
 
 mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& chain)
-    : Page(PageId::mikledet)
+    : Page(pageId)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
-    , m_timer1(moveMilliseconds, [this] { Timer1_Tick(); })
-    , m_timer2(sizeMilliseconds, [this] { Timer2_Tick(); }) {
+    , m_timer1(moveMilliseconds, [this] { moveOnce(); })
+    , m_timer2(sizeMilliseconds, [this] { resizeOnce(); }) {
     connect(&chain, &PageChain::shown, this, [this] {
         stopHolding();
         refresh(); // another picture may have been opened since
@@ -52,16 +48,18 @@ mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& cha
 void mikledet::load() {
     EditFields& edit = m_state.edit;
     Picture18Image = palette();
-    Frame1.visible = false;
     letters = m_state.english() ? KeyLayout::Letters::Small : KeyLayout::Letters::Hebrew;
     if (edit.TextOn == 0) {
         edit.TextFont = u"David"_s;
         edit.TextFontSize = 14;
-        Text1.text.clear();
-    } else {
-        Text1.text = edit.TextBody;
     }
-    Check4.checked = edit.TextOn != 0;
+    open(edit.TextOn == 0 ? QString() : edit.TextBody, edit.TextOn != 0);
+}
+
+void mikledet::open(const QString& text, bool onPicture) {
+    Text1.text = text;
+    Check4.checked = onPicture;
+    Q_EMIT changed();
 }
 
 void mikledet::setTexts() {
@@ -93,6 +91,11 @@ void mikledet::setTexts() {
     Image5[1].hint = say(u"הטקסט ממורכז בנקודה"_s, u"The text is centred on its point"_s);
     Image5[2].hint = say(u"הטקסט מסתיים בנקודה"_s, u"The text ends at its point"_s);
     Picture18.hint = say(u"צבע הטקסט"_s, u"Colour of the text"_s);
+    words.text = say(u"הטקסט שעל התמונה"_s, u"The text on the picture"_s);
+    words.hebrewLetters = say(u"אותיות בעברית"_s, u"Hebrew letters"_s);
+    words.smallLetters = say(u"אותיות קטנות באנגלית"_s, u"Small letters"_s);
+    words.capitalLetters = say(u"אותיות גדולות באנגלית"_s, u"Capital letters"_s);
+    words.blankKey = say(u"רווח"_s, u"Space"_s);
     relabel(letters);
 }
 
@@ -112,44 +115,32 @@ void mikledet::refresh() {
     Q_EMIT changed();
 }
 
-void mikledet::Command4_Click() {
-    relabel(KeyLayout::Letters::Hebrew);
-}
-
-void mikledet::Command9_Click() {
-    relabel(KeyLayout::Letters::Small);
-}
-
-void mikledet::Command2_Click() {
-    relabel(KeyLayout::Letters::Capital);
-}
-
-void mikledet::Command5_Click() {
+void mikledet::turnSymbols() {
     Frame1.visible = !Frame1.visible;
     Q_EMIT changed();
 }
 
-void mikledet::leter_Click(int key) {
+void mikledet::press(int key) {
     if (key >= 0 && key < KeyLayout::keys)
-        add(leter[static_cast<std::size_t>(key)].text);
+        type(leter[static_cast<std::size_t>(key)].text);
 }
 
 void mikledet::KeyPress(QChar character) {
     if (character == u' ') {
-        Command1_Click();
+        typeBlank();
     } else if (character == u'\r' || character == u'\n') {
-        Command7_Click();
+        breakLine();
     } else if (character == u'\b') {
-        Command3_Click();
+        takeBack();
     } else if (const auto text = KeyLayout::typed(character)) {
-        add(*text);
+        type(*text);
     } else if (character.isPrint() || character.isHighSurrogate()) {
         m_platform.dialogs.message(
             m_state.wording(u"אי אפשר להדפיס את הסימן הזה"_s, u"This character can't be printed"_s));
     }
 }
 
-void mikledet::add(const QString& text) {
+void mikledet::type(const QString& text) {
     if (Text1.text.size() >= mostLetters) {
         m_platform.dialogs.message(m_state.wording(u"עד  60  אותיות"_s, u"Up to 60 letters"_s));
         return;
@@ -160,51 +151,37 @@ void mikledet::add(const QString& text) {
     Q_EMIT changed();
 }
 
-void mikledet::Command1_Click() {
+void mikledet::typeBlank() {
     Text1.text += u' ';
     Q_EMIT changed();
 }
 
-void mikledet::Command3_Click() {
+void mikledet::takeBack() {
     if (Text1.text.isEmpty())
         return;
     Text1.text.chop(1);
     textChanged();
 }
 
-void mikledet::Command7_Click() {
+void mikledet::breakLine() {
     Text1.text += u"\r\n"_s;
     textChanged();
 }
 
-void mikledet::Command6_Click() {
+void mikledet::clear() {
     Text1.text.clear();
     textChanged();
     Frame1.visible = false;
     Q_EMIT changed();
 }
 
-void mikledet::Command8_Click() {
-    setTextOn(false);
-}
-
-void mikledet::Check4_Click(bool on) {
-    setTextOn(on);
-}
-
-void mikledet::setTextOn(bool on) {
+void mikledet::putOnPicture(bool on) {
     Check4.checked = on;
     m_state.edit.TextOn = on ? 1 : 0;
     commitText();
 }
 
-void mikledet::Command10_Click() {
-    Combo1List.clear();
-    Combo1List.append(u"David"_s);
-    Combo1_Click(0);
-}
-
-void mikledet::Combo1_Click(int index) {
+void mikledet::chooseFont(int index) {
     if (index < 0 || index >= Combo1List.count())
         return;
     Combo1List.setCurrentIndex(index);
@@ -213,29 +190,14 @@ void mikledet::Combo1_Click(int index) {
     commitText();
 }
 
-void mikledet::CommandDone_Click() {
+void mikledet::backToEditor() {
     stopHolding();
     Frame1.visible = false;
-    m_chain.follow(PageId::mikledet, Outcome::EditingDone);
-}
-
-void mikledet::Image1_MouseDown() {
-    holdSize(step);
-}
-
-void mikledet::Image2_MouseDown() {
-    holdSize(-step);
-}
-
-void mikledet::Image1_MouseUp() {
-    stopHolding();
-}
-
-void mikledet::Image2_MouseUp() {
-    stopHolding();
+    m_chain.follow(pageId, Outcome::EditingDone);
 }
 
 void mikledet::Image15_MouseDown(int direction) {
+    constexpr std::int16_t step = CaptionStep::step;
     switch (direction) {
     case 0:
         return holdMove(-step, 0);
@@ -250,10 +212,6 @@ void mikledet::Image15_MouseDown(int direction) {
     }
 }
 
-void mikledet::Image15_MouseUp() {
-    stopHolding();
-}
-
 void mikledet::holdSize(std::int16_t by) {
     SizeStep = by;
     m_held.press(m_timer2);
@@ -265,58 +223,49 @@ void mikledet::holdMove(std::int16_t x, std::int16_t y) {
     m_held.press(m_timer1);
 }
 
-void mikledet::stopHolding() {
-    m_held.release();
-}
-
-void mikledet::tickOnceIfNone() {
-    m_held.tickOnceIfNone();
-}
-
-void mikledet::Timer1_Tick() {
+void mikledet::moveOnce() {
     if (!m_held.ticks(m_timer1))
         return;
-    EditFields& edit = m_state.edit;
-    edit.TextX = HoldIn16Bits(edit.TextX + MoveStepX);
-    edit.TextY = HoldIn16Bits(edit.TextY + MoveStepY);
+    CaptionStep::move(m_state.edit, MoveStepX, MoveStepY);
     commitText();
 }
 
-void mikledet::Timer2_Tick() {
+void mikledet::resizeOnce() {
     if (!m_held.ticks(m_timer2))
         return;
-    m_state.edit.TextFontSize = HoldIn16Bits(m_state.edit.TextFontSize + SizeStep);
+    CaptionStep::resize(m_state.edit, SizeStep);
     commitText();
 }
 
-void mikledet::Image3_Click() {
-    std::int16_t& style = m_state.edit.TextStyle;
-    style = style > 2 ? std::int16_t{0} : HoldIn16Bits(style + 1);
+void mikledet::change(void (*step)(EditFields& edit)) {
+    step(m_state.edit);
     commitText();
 }
 
-void mikledet::Image4_Click() {
-    std::int16_t& vertical = m_state.edit.TextVertical;
-    vertical = vertical == EditRecord::runsDown ? std::int16_t{0} : EditRecord::runsDown;
-    commitText();
-}
-
-void mikledet::Image5_Click(int alignment) {
-    if (alignment < 0 || alignment > 2)
+void mikledet::align(int alignment) {
+    if (alignment < 0 || alignment > EditRecord::alignFar)
         return;
     m_state.edit.TextAlign = static_cast<std::int16_t>(alignment);
     commitText();
 }
 
-void mikledet::Picture18_MouseDown(QPoint at) {
+void mikledet::takeColour(QPoint at) {
     if (!Picture18Image.image().rect().contains(at))
         return;
-    const QRgb pixel = Picture18Image.image().pixel(at);
-    EditFields& edit = m_state.edit;
-    edit.TextRed = static_cast<std::int16_t>(qRed(pixel));
-    edit.TextGreen = static_cast<std::int16_t>(qGreen(pixel));
-    edit.TextBlue = static_cast<std::int16_t>(qBlue(pixel));
+    CaptionStep::colour(m_state.edit, Picture18Image.image().pixel(at));
     commitText();
+}
+
+int mikledet::style() const {
+    return m_state.edit.TextStyle & 3;
+}
+
+bool mikledet::runsDown() const {
+    return m_state.edit.TextVertical == EditRecord::runsDown;
+}
+
+QRgb mikledet::colour() const {
+    return qRgb(m_state.edit.TextRed, m_state.edit.TextGreen, m_state.edit.TextBlue);
 }
 
 void mikledet::textChanged() {
@@ -325,7 +274,7 @@ void mikledet::textChanged() {
 }
 
 void mikledet::commitText() {
-    m_chain.load<tFrmNew>().Command11_Click();
+    m_chain.load<tFrmNew>().takeCaption();
     refresh();
 }
 

@@ -1,17 +1,12 @@
 #pragma once
 
 #include "editing/HeldButton.h"
-#include "editing/caption/KeyLayout.h"
-#include "imaging/Bitmap.h"
-#include "session/Caption.h"
+#include "editing/caption/CaptionStep.h"
+#include "editing/caption/mikledetControls.h"
 #include "session/Page.h"
-#include "session/TextList.h"
 #include "session/Ticker.h"
 
 #include <QPoint>
-
-#include <array>
-#include <cstdint>
 
 namespace lumora {
 
@@ -19,89 +14,94 @@ struct Platform;
 struct SessionState;
 class PageChain;
 
-// The on-screen keyboard for a picture's caption, shown below the editor's picture. What it changes are the caption's
-// fields of the edit state; after each change it presses the editor's Command11, so that the picture and the list
-// follow at once. The editor sets Text1 and Check4 before it shows the page.
-class mikledet : public Page {
+// The on-screen keyboard: the customer writes a picture's caption on it, below the editor's picture.
+//
+// What it changes are the caption's fields of the edit state; the editor takes them after each change, so that the
+// picture and the list follow at once. Positions of the caption are in pixels of the preview.
+class mikledet : public Page, private mikledetControls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::mikledet;
+    static constexpr int mostLetters = 60;
 
     mikledet(SessionState& state, const Platform& platform, PageChain& chain);
 
     void load() override;
     void setTexts() override;
 
-    // Events. Positions of the caption are in pixels of the preview.
-    void leter_Click(int key); // adds the key's caption; the 61st letter is refused
-    void Command1_Click();     // a blank, which reaches the picture with the next key
-    void Command3_Click();     // takes the last character back
-    void Command7_Click();     // a new line
-    void Command6_Click();     // clears the text
-    void Command4_Click();     // Hebrew letters
-    void Command9_Click();     // small Latin letters
-    void Command2_Click();     // capital Latin letters
-    void Command5_Click();     // shows the further symbols; again: puts them away
-    void Command8_Click();     // takes the caption off the picture; its text stays in the record
-    void Check4_Click(bool on);
-    void Command10_Click(); // fills the font list and takes its first
-    void Combo1_Click(int index);
-    void Command13_Click() {}
-    void Command14_Click() {}
-    void CommandDone_Click(); // back to the editor
+    // --- events ---
+
+    // Begins with this caption; the editor brings the page to the front.
+    void open(const QString& text, bool onPicture);
+
+    void leter_Click(int key) { press(key); }
+    void Command1_Click() { typeBlank(); }
+    void Command3_Click() { takeBack(); }
+    void Command7_Click() { breakLine(); }
+    void Command6_Click() { clear(); }
+    void Command4_Click() { relabel(KeyLayout::Letters::Hebrew); }
+    void Command9_Click() { relabel(KeyLayout::Letters::Small); }
+    void Command2_Click() { relabel(KeyLayout::Letters::Capital); }
+    void Command5_Click() { turnSymbols(); }
+    void Command8_Click() { putOnPicture(false); } // its text stays in the record
+    void Check4_Click(bool on) { putOnPicture(on); }
+    void Combo1_Click(int index) { chooseFont(index); }
+    void CommandDone_Click() { backToEditor(); }
     // A real keyboard does what the keys do. What can't be printed is refused.
     void KeyPress(QChar character);
 
-    // Held: larger, smaller; left, right, up, down.
-    void Image1_MouseDown();
-    void Image1_MouseUp();
-    void Image2_MouseDown();
-    void Image2_MouseUp();
-    void Image15_MouseDown(int direction);
-    void Image15_MouseUp();
-    void Timer1_Tick(); // moves by the step
-    void Timer2_Tick(); // changes the size by the step
+    void Image1_MouseDown() { holdSize(CaptionStep::step); }
+    void Image2_MouseDown() { holdSize(-CaptionStep::step); }
+    void Image15_MouseDown(int direction); // left, right, up, down
+    void Image1_MouseUp() { stopHolding(); }
+    void Image2_MouseUp() { stopHolding(); }
+    void Image15_MouseUp() { stopHolding(); }
+    void Timer1_Tick() { moveOnce(); }
+    void Timer2_Tick() { resizeOnce(); }
     // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
-    void tickOnceIfNone();
-    // Lets go of what is held, as when the pointer is lost.
-    void stopHolding();
+    void tickOnceIfNone() { m_held.tickOnceIfNone(); }
+    // The pointer was lost or the page went.
+    void stopHolding() { m_held.release(); }
 
-    void Image3_Click();                 // next style: regular, bold, italic, both
-    void Image4_Click();                 // across or down
-    void Image5_Click(int alignment);    // near, centre, far
-    void Picture18_MouseDown(QPoint at); // takes the colour of this pixel of the palette
+    void Image3_Click() { change(CaptionStep::nextStyle); }
+    void Image4_Click() { change(CaptionStep::turn); }
+    void Image5_Click(int alignment) { align(alignment); }  // near, centre, far
+    void Picture18_MouseDown(QPoint at) { takeColour(at); } // a pixel of the palette
 
-    // State
-    Caption Text1; // what was typed; lines end in CR LF
-    std::array<Caption, KeyLayout::keys> leter;
-    KeyLayout::Letters letters = KeyLayout::Letters::Hebrew; // what the letter keys are labelled with
-    CheckCaption Check4;                                     // the caption is on the picture
-    TextList Combo1List;
-    Caption Combo1;        // the font
-    Caption Frame1;        // the panel of further symbols, keys KeyLayout::firstSymbol and on
-    Bitmap Picture18Image; // the palette: equal fields of one colour each, side by side
-    Caption Picture18;
-    std::int16_t SizeStep = 0;
-    std::int16_t MoveStepX = 0;
-    std::int16_t MoveStepY = 0;
-    Caption Title;
-    Caption Command1, Command3, Command5, Command6, Command7, Command8, Command10, Command13, Command14, CommandDone;
-    CheckCaption Command2, Command4, Command9; // the chosen letters are ticked
-    Caption Image1, Image2, Image3, Image4;
-    std::array<Caption, 4> Image15;     // left, right, up, down
-    std::array<CheckCaption, 3> Image5; // near, centre, far
+    // mikledetUnused.cpp
+    void Command10_Click(); // fills the font list and takes its first
+    void Command13_Click();
+    void Command14_Click();
 
-    static constexpr int mostLetters = 60;
+    // --- state ---
+
+    const mikledetControls& controls() const override { return *this; }
+    int style() const; // 0 regular, 1 bold, 2 italic, 3 both
+    bool runsDown() const;
+    QRgb colour() const;
 
 private:
-    void add(const QString& text);
+    void press(int key);
+    void type(const QString& text);
+    void typeBlank();
+    void takeBack();
+    void breakLine();
+    void clear();
     void textChanged();
-    void commitText();
     void relabel(KeyLayout::Letters to);
+    void turnSymbols();
+    void putOnPicture(bool on);
+    void chooseFont(int index);
+    void align(int alignment);
+    void takeColour(QPoint at);
+    void change(void (*step)(EditFields& edit));
+    void commitText();
     void refresh();
-    void setTextOn(bool on);
     void holdSize(std::int16_t step);
     void holdMove(std::int16_t x, std::int16_t y);
+    void moveOnce();
+    void resizeOnce();
+    void backToEditor();
 
     SessionState& m_state;
     const Platform& m_platform;

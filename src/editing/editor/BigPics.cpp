@@ -1,6 +1,5 @@
 #include "editing/editor/BigPics.h"
 
-#include "imaging/drawing/ColourMatrix.h"
 #include "imaging/scaling/Resample.h"
 
 #include <algorithm>
@@ -14,21 +13,14 @@ constexpr int sampledWidth = 300;
 
 } // namespace
 
-void BigPics::Command1_Click() {
+void BigPics::turnGrey() {
     if (!CipCip)
         return;
     CipCip->turnGrey();
     Q_EMIT changed();
 }
 
-void BigPics::Picture1Grey_Click() {
-    if (Picture1.isNull())
-        return;
-    Picture1 = ColourMatrix::grey(greyWeight).applied(Picture1);
-    Q_EMIT changed();
-}
-
-void BigPics::Command2_Click() {
+void BigPics::measureLevels() {
     if (!CipCip)
         return;
     const Bitmap& work = CipCip->workPicture();

@@ -12,29 +12,16 @@
 
 namespace lumora {
 
-// The editor's work surfaces; nobody ever sees this page. The editor makes it with PageChain::load, puts the opened
-// picture into CipCip and presses the buttons. Without a picture they do nothing.
-class BigPics : public Page {
-    Q_OBJECT
-public:
-    static constexpr PageId pageId = PageId::BigPics;
-
-    BigPics()
-        : Page(PageId::BigPics) {}
-
-    // Events
-    void Command1_Click();     // turns the work picture grey
-    void Command2_Click();     // the automatic level step: measures the work picture and leaves it as it is
-    void Picture1Grey_Click(); // turns Picture1 grey
-
-    // State
+struct BigPicsControls : Controls {
     std::optional<EditedPreview> CipCip; // the work picture of the editor
     Bitmap Picture1;                     // a second surface of the same use
     Bitmap Picture2;                     // the work picture, 400 wide, as it was measured
-    QRect Image_crop;                    // the middle three quarters of Picture2, from which the samples come
-    TextList List1, List2, List3;        // the samples of red, green and blue in text order
+    QRect Image_crop;                    // the middle three quarters of Picture2: the samples come from it
+    TextList List1{*this, u"List1"};     // the samples of red in text order
+    TextList List2{*this, u"List2"};     // of green
+    TextList List3{*this, u"List3"};     // of blue
 
-    // What the level step found. The lab's tools may come to read it; no page does.
+    // What the level step found. No page reads it.
     struct AutoLevels {
         ChannelValues gains{};
         ChannelValues floors{};
@@ -42,6 +29,33 @@ public:
         float ceiling = 245; // to where the brightest may be brought
     };
     AutoLevels levels;
+};
+
+// The editor's work picture: the editor draws its previews from it and measures it; nobody sees the page.
+class BigPics : public Page, private BigPicsControls {
+    Q_OBJECT
+public:
+    static constexpr PageId pageId = PageId::BigPics;
+
+    BigPics()
+        : Page(pageId) {}
+
+    // Events. Without a picture they do nothing.
+    void open(EditedPreview picture) { CipCip = std::move(picture); }
+    void close() { CipCip.reset(); }
+    void turnGrey();
+    void measureLevels(); // leaves the work picture as it is
+
+    void Command1_Click() { turnGrey(); }
+    void Command2_Click() { measureLevels(); }
+
+    // BigPicsUnused.cpp
+    void openSecond(Bitmap picture);
+    void Picture1Grey_Click();
+
+    // State
+    const BigPicsControls& controls() const override { return *this; }
+    EditedPreview* workPicture() { return CipCip ? &*CipCip : nullptr; }
 };
 
 } // namespace lumora

@@ -6,8 +6,8 @@
 
 namespace lumora {
 
-// A handle that follows the pointer at a thirteenth of its way at each move, measured from where it was pressed: the
-// anchor stays, so that a far drag goes faster and a pointer that stands still moves nothing. Fractions are kept.
+// A handle that the pointer drags. Each move takes it a thirteenth of the pointer's distance from where it was pressed,
+// so that a far drag goes faster. Fractions are kept.
 class DragHandle {
 public:
     static constexpr double slowness = 13;

@@ -14,13 +14,13 @@ namespace {
 
 constexpr int boxWidth = 700;
 constexpr int mostBoxHeight = 20'000;
-// Pixels of the picture for one of the box, for screens on which the page is shown larger.
+// Pixels of the picture for one logical pixel of the box: the page may be shown larger.
 constexpr int fineness = 2;
 
 } // namespace
 
 Form3::Form3(const SessionState& state, const Platform& platform, PageChain& chain)
-    : Page(PageId::Form3)
+    : Page(pageId)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain) {}
@@ -33,23 +33,23 @@ void Form3::setTexts() {
     Command1.text = m_state.wording(QStringLiteral("סובב"), QStringLiteral("Turn"));
     Command2.text = m_state.wording(QStringLiteral("הצג שוב"), QStringLiteral("Show again"));
     Command3.text = m_state.wording(QStringLiteral("יציאה"), QStringLiteral("Exit"));
+    unreadable =
+        m_state.wording(QStringLiteral("אי אפשר להציג את התמונה"), QStringLiteral("The picture can't be shown"));
     Q_EMIT changed();
 }
 
-void Form3::showPicture(const QString& path) {
+void Form3::open(const QString& path) {
     Label1.text = path;
     angle = 0;
-    Command2_Click();
+    draw();
 }
 
-void Form3::Command1_Click() {
-    angle += 90;
-    if (angle >= 360)
-        angle = 0;
-    Command2_Click();
+void Form3::turn() {
+    angle = (angle + 90) % 360;
+    draw();
 }
 
-void Form3::Command2_Click() {
+void Form3::draw() {
     Picture2 = {};
     Picture2Box = {};
     const auto read = [this]() -> Result<Bitmap> {
@@ -61,7 +61,7 @@ void Form3::Command2_Click() {
             return size.failure();
         const double aspect = static_cast<double>(size->height) / size->width;
         Picture2Box = {boxWidth, std::clamp(static_cast<int>(boxWidth * aspect), 1, mostBoxHeight)};
-        // A very tall picture gains nothing from being finer than its file.
+        // More pixels than the file has would add nothing.
         const int times = Picture2Box.height > size->height ? 1 : fineness;
         return loadPictureScaled(*file, {Picture2Box.width * times, Picture2Box.height * times});
     };
@@ -77,8 +77,8 @@ void Form3::Command2_Click() {
     Q_EMIT changed();
 }
 
-void Form3::Command3_Click() {
-    m_chain.unload(PageId::Form3);
+void Form3::close() {
+    m_chain.unload(pageId);
 }
 
 } // namespace lumora

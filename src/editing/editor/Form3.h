@@ -11,9 +11,17 @@ struct Platform;
 struct SessionState;
 class PageChain;
 
-// A picture to look at, turned by quarters. Nothing of it is kept. Whoever opens the page calls showPicture and brings
-// it to the front.
-class Form3 : public Page {
+struct Form3Controls : Controls {
+    Caption Label1{*this, u"Label1"}; // drive path of the picture
+    Caption Command1{*this, u"Command1"}, Command2{*this, u"Command2"}, Command3{*this, u"Command3"};
+    int angle = 0;           // 0, 90, 180 or 270 degrees clockwise
+    PictureSize Picture2Box; // the box of the picture in logical pixels; the view puts it in the middle
+    Bitmap Picture2;         // the turned picture, finer than its box; null when it can't be read
+    QString unreadable;      // stands in place of a picture that can't be read
+};
+
+// A picture turned, to look at: the customer sees one picture of the page of pictures large. Nothing of it is kept.
+class Form3 : public Page, private Form3Controls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::Form3;
@@ -23,22 +31,20 @@ public:
     void load() override;
     void setTexts() override;
 
-    // Opens the picture of a drive path, upright.
-    void showPicture(const QString& path);
-
     // Events
-    void Command1_Click(); // a quarter turn clockwise
-    void Command2_Click(); // reads and draws the picture again
-    void Command3_Click(); // closes the page
+    void open(const QString& path); // a drive path, upright; who opens it brings the page to the front
+    void Command1_Click() { turn(); }
+    void Command2_Click() { draw(); }
+    void Command3_Click() { close(); }
 
     // State
-    Caption Label1; // the path of the picture
-    Caption Command1, Command2, Command3;
-    int angle = 0;           // 0, 90, 180 or 270 degrees clockwise
-    PictureSize Picture2Box; // the box of the picture in logical pixels; the view puts it in the middle
-    Bitmap Picture2;         // the turned picture, finer than its box; null when it can't be read
+    const Form3Controls& controls() const override { return *this; }
 
 private:
+    void turn(); // a quarter clockwise
+    void draw(); // reads the file again
+    void close();
+
     const SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;

@@ -43,7 +43,7 @@ constexpr std::array<const char*, 21> statusTexts = {
     "Property Not Supported.",
 };
 
-// The number under which the drawing library would have reported the failure.
+// The drawing library's status number for a failure.
 int statusOf(Failure::Kind kind) {
     switch (kind) {
     case Failure::Kind::NotFound:
@@ -65,7 +65,7 @@ int statusOf(Failure::Kind kind) {
 } // namespace
 
 gdisave::gdisave(SessionState& state, const Platform& platform, PageChain& chain, Starter start)
-    : Page(PageId::gdisave)
+    : Page(pageId)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
@@ -73,13 +73,13 @@ gdisave::gdisave(SessionState& state, const Platform& platform, PageChain& chain
 
 void gdisave::load() {
     GdiReady = false;
-    // The drawing of this system is always there; a start that fails is one that was handed in.
+    // This system's drawing needs no start, so only a starter that was handed in can fail.
     const int status = m_start ? m_start() : 0;
     ShowGdiStatus(status);
     if (status != 0)
         m_platform.dialogs.message(QStringLiteral("GDI+ not inizialized."), QStringLiteral("GDI Error"));
     GdiReady = status == 0;
-    HScroll1_Change(HScroll1);
+    setTexts();
 }
 
 void gdisave::setTexts() {
@@ -93,17 +93,9 @@ void gdisave::setTexts() {
     Q_EMIT changed();
 }
 
-void gdisave::Command1_Click() {
-    m_chain.unload(PageId::gdisave);
-}
-
-void gdisave::Command5_Click() {
-    if (GdiReady)
-        SaveJpeg(PicPic, WorkspacePaths::scratchPicture(m_state), 80);
-}
-
-// An order may hold the sheet under both names: the HTTP sender and a local station take the plain picture.
-void gdisave::Command6_Click() {
+// The FTP sender takes the sheet as ".jpp", the HTTP sender and a local station take it as ".jpg".
+void gdisave::saveOrderSheet(const Bitmap& picture) {
+    PicPic = picture;
     if (!GdiReady)
         return;
     const auto save = [this](const QString& ending) {
@@ -116,14 +108,10 @@ void gdisave::Command6_Click() {
         save(QStringLiteral(".jpg"));
 }
 
-void gdisave::Command7_Click() {
+void gdisave::saveProof(const Bitmap& picture) {
+    LitlPic = picture;
     if (GdiReady)
         SaveJpeg(LitlPic, WorkspacePaths::proofPicture(m_state), 70);
-}
-
-void gdisave::HScroll1_Change(int value) {
-    HScroll1 = std::clamp(value, HScroll1Min, HScroll1Max);
-    setTexts();
 }
 
 bool gdisave::SaveJpeg(const Bitmap& picture, const QString& path, int quality) {
@@ -139,8 +127,12 @@ bool gdisave::SaveJpeg(const Bitmap& picture, const QString& path, int quality) 
     const Result<QByteArray> jpeg = encodeJpeg(picture, std::clamp(quality, HScroll1Min, HScroll1Max));
     const Result<void> saved = jpeg ? m_platform.files.writeWhole(path, *jpeg) : Result<void>(jpeg.failure());
     if (!saved)
-        ShowGdiStatus(statusOf(saved.failure().kind), saved.failure().message);
+        showFailure(saved.failure());
     return saved.ok();
+}
+
+void gdisave::showFailure(const Failure& failure) {
+    ShowGdiStatus(statusOf(failure.kind), failure.message);
 }
 
 int gdisave::ShowGdiStatus(int status, const QString& detail) {
@@ -163,16 +155,6 @@ std::optional<gdisave::Encoder> gdisave::FindEncoderClsid(const QString& mimeTyp
     if (mimeType.compare(QLatin1String("image/jpeg"), Qt::CaseInsensitive) == 0)
         return Encoder::Jpeg;
     return std::nullopt;
-}
-
-Bitmap gdisave::PictureFromFile(const QString& path) {
-    const std::optional<HostPath> host = m_platform.files.drives().toHost(path);
-    const Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path};
-    if (!picture) {
-        ShowGdiStatus(statusOf(picture.failure().kind), picture.failure().message);
-        return {};
-    }
-    return *picture;
 }
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "session/Caption.h"
 #include "session/Page.h"
@@ -13,9 +14,21 @@ struct Platform;
 struct SessionState;
 class PageChain;
 
-// The service page that saves pictures as JPEG; nobody ever sees it. Other pages make it with PageChain::load, put
-// their picture into PicPic or LitlPic and press a button. It stays loaded until the program ends.
-class gdisave : public Page {
+struct gdisaveControls : Controls {
+    Bitmap PicPic;  // the picture of the preparation page
+    Bitmap LitlPic; // the summary of the sending page
+    bool GdiReady = false;
+    static constexpr int HScroll1Min = 0;
+    static constexpr int HScroll1Max = 100;
+    int HScroll1 = 85;
+    Caption Label1{*this, u"Label1"}; // the value of HScroll1
+    Caption Command1{*this, u"Command1"}, Command2{*this, u"Command2"}, Command5{*this, u"Command5"},
+        Command6{*this, u"Command6"}, Command7{*this, u"Command7"}, cmdSaveAsJpg{*this, u"cmdSaveAsJpg"};
+};
+
+// The saver: the preparation and sending pages save their pictures as JPEG by it; nobody sees the page, which stays
+// loaded until the program ends. Nothing is saved unless GdiReady is set.
+class gdisave : public Page, private gdisaveControls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::gdisave;
@@ -28,45 +41,41 @@ public:
     void load() override;
     void setTexts() override;
 
-    // Events. A button acts only when GdiReady is set.
-    void Command5_Click(); // PicPic as the scratch picture, quality 80
-    void Command6_Click(); // PicPic as the order sheet, quality 90
-    void Command7_Click(); // LitlPic as the proof picture 000.jpg, quality 70
+    // Events
+    void saveOrderSheet(const Bitmap& picture); // quality 90, under the names of the order's sheet
+    void saveProof(const Bitmap& picture);      // quality 70, as 000.jpg
+    void Command6_Click() { saveOrderSheet(PicPic); }
+    void Command7_Click() { saveProof(LitlPic); }
+
+    // gdisaveUnused.cpp
+    void saveScratch(const Bitmap& picture); // quality 80, as the picture of the current step
+    void Command5_Click() { saveScratch(PicPic); }
     void Command1_Click(); // closes the page
     void HScroll1_Change(int value);
-    // Buttons of the page that do nothing.
-    void cmdSaveAsJpg_Click() {}
-    void Command2_Click() {}
-    void Command3_Click() {}
-    void Command4_Click() {}
-    void Command8_Click() {}
-    void Command9_Click() {}
-
-    // State
-    Bitmap PicPic;  // the picture of the preparation page
-    Bitmap LitlPic; // the summary of the sending page
-    bool GdiReady = false;
-    static constexpr int HScroll1Min = 0;
-    static constexpr int HScroll1Max = 100;
-    int HScroll1 = 85;
-    Caption Label1; // the value of HScroll1
-    Caption Command1, Command2, Command5, Command6, Command7, cmdSaveAsJpg;
+    void cmdSaveAsJpg_Click();
+    void Command2_Click();
+    void Command3_Click();
+    void Command4_Click();
+    void Command8_Click();
+    void Command9_Click();
+    Bitmap PictureFromFile(const QString& path); // null when the file can't be read; the failure is shown
 
     // Saves under a drive path; the quality is held within 0 to 100. A failure is shown and gives false.
     bool SaveJpeg(const Bitmap& picture, const QString& path, int quality);
     // Shows a status that is not 0 in a box, with the path and reason behind it where they are known. Returns the
     // status.
     int ShowGdiStatus(int status, const QString& detail = {});
-    static QString GdiStatusText(int status);
 
+    // State
+    const gdisaveControls& controls() const override { return *this; }
+    static QString GdiStatusText(int status);
     enum class Encoder { Jpeg };
     // The encoder of a MIME type, whatever its letter case.
     static std::optional<Encoder> FindEncoderClsid(const QString& mimeType);
 
-    // Null when the file can't be read; the failure is shown.
-    Bitmap PictureFromFile(const QString& path);
-
 private:
+    void showFailure(const Failure& failure);
+
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;

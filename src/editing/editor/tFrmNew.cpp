@@ -26,33 +26,30 @@ tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain
     , m_platform(platform)
     , m_chain(chain)
     , m_frames(platform.files, WorkspacePaths::misgarot(state))
-    , Timer2(holdMilliseconds, [this] { Timer2_Tick(); })
-    , Timer3(holdMilliseconds, [this] { Timer3_Tick(); })
-    , Timer6(holdMilliseconds, [this] { Timer6_Tick(); })
-    , Timer7(holdMilliseconds, [this] { Timer7_Tick(); })
-    , Timer8(holdMilliseconds, [this] { Timer8_Tick(); }) {
-    // Whatever comes to the front, nobody holds a button of this page any more.
+    , Timer2(holdMilliseconds, [this] { zoom(); })
+    , Timer3(holdMilliseconds, [this] { brighten(); })
+    , Timer6(holdMilliseconds, [this] { turn(); })
+    , Timer7(holdMilliseconds, [this] { moveAcross(); })
+    , Timer8(holdMilliseconds, [this] { moveDown(); }) {
+    // Nobody holds a button of this page once another page is in front.
     connect(&chain, &PageChain::shown, this, &tFrmNew::stopHolds);
 }
 
 tFrmNew::~tFrmNew() = default;
 
 void tFrmNew::load() {
-    // A size without two numbers, as that of an order of mixed sizes, leaves the usual paper.
+    // An order of mixed sizes, "zz/zz", has no paper size: the editor then shows 10/15.
     const QString code = SizeCode(m_state.shemot.ppr);
     if (PaperSize::ofDigits(code))
         PaperSizeCode = code;
     PicPicSize = previewBox(*PaperSize::ofDigits(PaperSizeCode), PaperOrientation::Landscape);
 
-    for (Caption* hidden : {&Frame3, &Frame4, &Labeltext, &Picture3, &Command10, &Command12, &Command23, &Command24})
-        hidden->visible = false;
     for (Caption* operators : {&Frame5, &Label13})
         operators->visible = m_state.DegelEdit;
 
     Misgerett.checked = true;
-    for (const int style : {1, 2, 5, 6, 7, 8, 13, 14, 21, 22, 23, 24, 25, 26, 27, 28, 29})
-        Combo5List.append(QString::number(style));
-    // Without the folder there are no frames to offer, and nothing else is lost.
+    Combo5List.append(LineFrameChoice::styles());
+    // A folder that can't be made only means that no frames are on offer.
     if (!m_platform.files.folderExists(WorkspacePaths::misgarot(m_state)))
         static_cast<void>(m_platform.files.makeFolder(WorkspacePaths::misgarot(m_state)));
     Combo4List.append(m_frames.categories());
@@ -75,8 +72,7 @@ BigPics& tFrmNew::surfaces() const {
 }
 
 EditedPreview* tFrmNew::workPicture() const {
-    std::optional<EditedPreview>& work = surfaces().CipCip;
-    return work ? &*work : nullptr;
+    return surfaces().workPicture();
 }
 
 HostPath tFrmNew::hostOf(const QString& path) const {
@@ -97,7 +93,7 @@ void tFrmNew::hidePanels() {
 
 // --- opening ---
 
-void tFrmNew::Command17_Click() {
+void tFrmNew::openPicture() {
     OpenPictureInEditor();
     Q_EMIT changed();
 }
@@ -107,7 +103,7 @@ void tFrmNew::OpenPictureInEditor() {
     ++m_openings;
     m_open = false;
     m_frameKey.clear();
-    surfaces().CipCip.reset();
+    surfaces().close();
     PicPic = Bitmap();
     hidePanels();
 
@@ -121,9 +117,9 @@ void tFrmNew::OpenPictureInEditor() {
     if (!m_open)
         return;
     if (edit().AutoMarker == EditRecord::levelled)
-        surfaces().Command2_Click();
+        surfaces().measureLevels();
     if (edit().ToneFlag == 1)
-        surfaces().Command1_Click();
+        surfaces().turnGrey();
     workPicture()->placeAtCentreIfUnset(edit());
     putHandle(QPointF(edit().PanX, edit().PanY));
     packRenderStore();
@@ -140,7 +136,7 @@ bool tFrmNew::loadPictureOfRecord() {
     const QString copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
     if (m_platform.files.fileExists(copy))
         return LoadWorkBitmap(copy);
-    // The picture without the correction, here and in the print, and never what lies under another name.
+    // The picture is then shown and printed without the correction.
     edit().RedMarker = EditRecord::notMarked;
     if (!LoadWorkBitmap(edit().PicturePath))
         return false;
@@ -158,7 +154,7 @@ bool tFrmNew::LoadWorkBitmap(const QString& path) {
              QStringLiteral("The picture can't be opened for editing"), opened.failure().message);
         return false;
     }
-    surfaces().CipCip = std::move(*opened);
+    surfaces().open(std::move(*opened));
     PicPicSize = workPicture()->box();
     writeWorkFile();
     return true;
@@ -171,13 +167,13 @@ void tFrmNew::writeWorkFile() {
     workPicture()->workPicture().image().save(&buffer, "BMP");
     const Result<void> written =
         m_platform.files.writePassing(JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("0.bmp")), bytes);
-    // Editing goes on without that file; one word about it is enough.
+    // Editing needs no work file, so its failure is told once.
     if (!written && !m_workFileFailed)
         m_platform.dialogs.message(written.failure().message);
     m_workFileFailed = !written;
 }
 
-void tFrmNew::Command2_Click() {
+void tFrmNew::pickAnotherPicture() {
     stopHolds();
     const QString picture = m_platform.dialogs.pickFile(
         m_state.wording(QStringLiteral("לחץ על תמונה אחת פעמיים וכל התמונות מהתיקייה תוצגנה "),
@@ -187,7 +183,7 @@ void tFrmNew::Command2_Click() {
                         QStringLiteral("Choose one picture and all the pictures will be shown")));
     if (picture.isEmpty())
         return;
-    CommandDone_Click();
+    backToPictures();
     // The record of the picture that is left keeps its zoom and gains.
     m_open = false;
     edit().ZoomPercent = 100;
@@ -196,13 +192,12 @@ void tFrmNew::Command2_Click() {
     Q_EMIT picked(picture);
 }
 
-void tFrmNew::CommandDone_Click() {
+void tFrmNew::backToPictures() {
     stopHolds();
     hidePanels();
-    if (m_chain.find(PageId::mikledet) != nullptr)
-        m_chain.unload(PageId::mikledet);
+    m_chain.unload(PageId::mikledet);
     Q_EMIT left();
-    m_chain.follow(PageId::tFrmNew, Outcome::EditingDone);
+    m_chain.follow(pageId, Outcome::EditingDone);
 }
 
 // --- the record ---
@@ -219,7 +214,7 @@ void tFrmNew::handleToFields() {
 }
 
 void tFrmNew::PackEditState() {
-    // Before a picture is open the handle stands nowhere.
+    // The handle has no place before a picture is open.
     if (m_open)
         handleToFields();
     lumora::PackEditState(edit(), LeftField(m_state.shemot.Bord, 2), Combo4.text);
@@ -259,7 +254,7 @@ void tFrmNew::renderPackStore() {
     StoreCurrentEdit();
 }
 
-void tFrmNew::Command5_Click() {
+void tFrmNew::keepRecord() {
     if (!m_open)
         return;
     PackEditState();
@@ -267,7 +262,9 @@ void tFrmNew::Command5_Click() {
     Q_EMIT changed();
 }
 
-void tFrmNew::UndoAllEdits() {
+void tFrmNew::undoAllEdits() {
+    if (!m_open)
+        return;
     stopHolds();
     const std::int16_t zoomBefore = PreviewZoom;
     PreviewZoom = 100; // decides the size of the work picture
@@ -275,13 +272,8 @@ void tFrmNew::UndoAllEdits() {
         PreviewZoom = zoomBefore;
         return;
     }
-    EditFields& fields = edit();
-    fields.ToneFlag = 0;
-    fields.GainR = fields.GainG = fields.GainB = 1;
-    fields.SpareFlag = 0;
-    fields.ZoomPercent = 100;
-    fields.RotationCode = 180;
-    // By the paper as it is now: it may be another one than before the reload.
+    ColourStep::undo(edit());
+    // The reload may have changed the paper, so the centre is that of the new one.
     putHandle(QPointF(PicPicSize.width / 2, PicPicSize.height / 2));
     handleToFields();
     renderPackStore();
@@ -295,7 +287,13 @@ void tFrmNew::showNumbers() {
     Label11.text = QString::number(PreviewZoom);
 }
 
-void tFrmNew::Command4_Click() {
+// RotationCode is 180 for an upright picture.
+int tFrmNew::turnDegrees() const {
+    const int angle = (m_state.edit.RotationCode - 180 + 720) % 360;
+    return angle > 180 ? angle - 360 : angle;
+}
+
+void tFrmNew::lookQuickly() {
     if (!m_open)
         return;
     const Bitmap& work = workPicture()->workPicture();
@@ -310,28 +308,12 @@ void tFrmNew::Command4_Click() {
     Q_EMIT changed();
 }
 
-void tFrmNew::Command6_Click() {
+void tFrmNew::measureLevels() {
     if (!m_open)
         return;
-    surfaces().Command2_Click();
+    surfaces().measureLevels();
     edit().AutoMarker = EditRecord::levelled;
     packRenderStore();
-}
-
-void tFrmNew::Command24_Click() {
-    PaperSizeCode = QStringLiteral("1014");
-}
-
-void tFrmNew::Command12_Click() {
-    PaperSizeCode = QStringLiteral("1015");
-}
-
-void tFrmNew::Command10_Click() {
-    PaperSizeCode = QStringLiteral("1318");
-}
-
-void tFrmNew::Command23_Click() {
-    PaperSizeCode = QStringLiteral("1521");
 }
 
 void tFrmNew::setPreviewScale(double scale) {
@@ -343,18 +325,18 @@ void tFrmNew::setPreviewScale(double scale) {
         RenderPreview();
 }
 
-void tFrmNew::Image29_Click() {
+void tFrmNew::turnHints() {
     hintsAsLabels = !hintsAsLabels;
     setTexts();
 }
 
-void tFrmNew::Image13_MouseMove() {
+void tFrmNew::showTones() {
     Frame3.visible = true;
     Frame4.visible = false;
     Q_EMIT changed();
 }
 
-void tFrmNew::Image15_MouseMove() {
+void tFrmNew::showTurns() {
     Frame4.visible = true;
     Frame3.visible = false;
     Q_EMIT changed();
@@ -362,23 +344,18 @@ void tFrmNew::Image15_MouseMove() {
 
 // --- the crop markers ---
 
-void tFrmNew::Command14_Click() {
+void tFrmNew::markCorners() {
     crop.toCorners(PicPicSize);
     Q_EMIT changed();
 }
 
-void tFrmNew::Command13_Click() {
+void tFrmNew::markInset() {
     crop.toInset(PicPicSize);
     Q_EMIT changed();
 }
 
-void tFrmNew::Command16_Click() {
-    crop.widen(CropFrame::step);
-    Q_EMIT changed();
-}
-
-void tFrmNew::Command15_Click() {
-    crop.widen(-CropFrame::step);
+void tFrmNew::widenMarkers(int pixels) {
+    crop.widen(pixels);
     Q_EMIT changed();
 }
 
@@ -392,10 +369,6 @@ void tFrmNew::CropHandle_MouseMove(QPointF at) {
         return;
     crop.drag(m_cropCorner, m_cropHandle.distance(at));
     Q_EMIT changed();
-}
-
-void tFrmNew::CropHandle_MouseUp() {
-    m_cropHandle.release();
 }
 
 } // namespace lumora

@@ -1,22 +1,17 @@
 #pragma once
 
 #include "editing/HeldButton.h"
+#include "editing/editor/ColourStep.h"
 #include "editing/editor/DragHandle.h"
-#include "editing/render/CropFrame.h"
+#include "editing/editor/LineFrameChoice.h"
+#include "editing/editor/tFrmNewControls.h"
 #include "editing/render/FrameLists.h"
-#include "editing/render/LineFramePalette.h"
-#include "editing/render/TextLabelPlace.h"
-#include "imaging/Bitmap.h"
-#include "imaging/files/PictureFile.h"
 #include "platform/files/HostPath.h"
-#include "session/Caption.h"
 #include "session/Page.h"
-#include "session/TextList.h"
 #include "session/Ticker.h"
 
 #include <QPointF>
 
-#include <array>
 #include <cstdint>
 #include <map>
 #include <optional>
@@ -30,16 +25,16 @@ struct EditFields;
 struct Platform;
 struct SessionState;
 
-// The editor: one picture on its paper, with zoom, place, turn, colour, frame and caption. What the customer does
-// changes the edit fields of the session, which are packed into the record and handed to the page of pictures at once,
-// so that leaving needs no saving. The controls differ on purpose in when they pack, draw and store.
+// The editor: the customer changes how one picture will be printed, its zoom, place, turn, colour, frame and caption.
 //
-// All positions are in the logical pixels of the paper, 450 wide when it lies and 300 when it stands; a view that shows
-// it larger maps what it is told.
-class tFrmNew : public Page {
+// Each change goes into the edit fields of the session, which are packed into the record and handed to the page of
+// pictures at once, so that leaving needs no saving. The controls differ on purpose in when they pack, draw and store.
+// Positions are in the logical pixels of the paper, 450 wide when it lies and 300 when it stands; they may lie outside.
+class tFrmNew : public Page, private tFrmNewControls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::tFrmNew;
+    using Tone = ColourStep::Tone;
 
     tFrmNew(SessionState& state, const Platform& platform, PageChain& chain);
     ~tFrmNew() override;
@@ -47,163 +42,119 @@ public:
     void load() override;
     void setTexts() override;
 
-    // --- events ---
+    // --- events: by other pages ---
 
-    // How many real pixels a logical pixel of the paper has on this screen, held within 1 to 2: a tick stays a twelfth
-    // of its time then.
+    void openPicture(); // of the session's edit fields
+    void takeCaption(); // the caption's fields were changed: packs, draws, stores, places Labeltext
+    void keepRecord();  // packs and stores
+    // The pointer was lost or the page went: what is in hand is let go as by its MouseUp.
+    void stopHolds();
+
+    void Command17_Click() { openPicture(); }
+    void Command11_Click() { takeCaption(); }
+    void Command5_Click() { keepRecord(); }
+
+    // --- events: by the customer ---
+
+    // Screen pixels for a logical pixel of the paper, held within 1 to largestScale so that a tick stays quick.
     static constexpr double largestScale = 2;
     void setPreviewScale(double scale);
 
-    // Pressed by other pages.
-    void Command17_Click(); // opens the picture of the session's edit fields
-    void Command11_Click(); // the caption was changed: packs, draws, stores, places Labeltext
-    void Command5_Click();  // packs and stores
+    void Command2_Click() { pickAnotherPicture(); }
+    void CommandDone_Click() { backToPictures(); }
+    void Image29_Click() { turnHints(); }
+    void Command8_Click() { writeCaption(); }
+    void Command6_Click() { measureLevels(); }
+    void Command4_Click() { lookQuickly(); }
+    // Paper of the next picture that is opened.
+    void Command24_Click() { choosePaper(QStringLiteral("1014")); }
+    void Command12_Click() { choosePaper(QStringLiteral("1015")); }
+    void Command10_Click() { choosePaper(QStringLiteral("1318")); }
+    void Command23_Click() { choosePaper(QStringLiteral("1521")); }
 
-    void Command2_Click();    // picks a picture by the file dialog
-    void CommandDone_Click(); // back to the pictures
-    void Image29_Click();     // shows the hints
-    void Command4_Click();    // "zoom": a quick look at the work picture
-    void Command8_Click();    // the caption and its keyboard
-    void Command6_Click();    // automatic level step
-    // Paper of the next picture that is opened: 10/14, 10/15, 13/18, 15/21.
-    void Command24_Click();
-    void Command12_Click();
-    void Command10_Click();
-    void Command23_Click();
-
-    // Image2: 0 and 1 zoom in and out, 3 and 4 darker and lighter (held); 5 undo, 6 red, 7 red-eye, 8 no added
+    // Image2: 0 and 1 closer and further, 3 and 4 darker and lighter (held); 5 undo, 6 red, 7 red-eye, 8 no added
     // colours, 10 blue (clicked). 2 and 9 do nothing.
     void Image2_MouseDown(int index);
-    void Image2_MouseUp(int index);
+    void Image2_MouseUp(int) { endHold(); }
     void Image2_Click(int index);
-    void Image2_MouseMove(); // hides the panels Frame3 and Frame4
+    void Image2_MouseMove() { hidePanels(); }
 
-    // Held: the picture to the right, left, up and down.
-    void Image135_MouseDown();
-    void Image115_MouseDown();
-    void Image125_MouseDown();
-    void Image145_MouseDown();
+    void Image135_MouseDown() { beginHold(Held::Right); }
+    void Image115_MouseDown() { beginHold(Held::Left); }
+    void Image125_MouseDown() { beginHold(Held::Up); }
+    void Image145_MouseDown() { beginHold(Held::Down); }
+    void Image16_MouseDown() { beginHold(Held::TurnRight); }
+    void Image17_MouseDown() { beginHold(Held::TurnLeft); }
     void Image135_MouseUp() { endHold(); }
     void Image115_MouseUp() { endHold(); }
     void Image125_MouseUp() { endHold(); }
     void Image145_MouseUp() { endHold(); }
-    // Held: turn by single degrees.
-    void Image16_MouseDown();
-    void Image17_MouseDown();
     void Image16_MouseUp() { endHold(); }
     void Image17_MouseUp() { endHold(); }
-    // Clicked.
-    void Image15_Click(); // a quarter turn clockwise
-    void Image18_Click(); // and back
-    void Image27_Click(); // cancels the turn
-
     // What a held button does each 50 ms.
-    void Timer2_Tick(); // zoom
-    void Timer3_Tick(); // brightness
-    void Timer6_Tick(); // turn
-    void Timer7_Tick(); // to the side
-    void Timer8_Tick(); // up and down
+    static constexpr int holdMilliseconds = 50;
+    void Timer2_Tick() { zoom(); }
+    void Timer3_Tick() { brighten(); }
+    void Timer6_Tick() { turn(); }
+    void Timer7_Tick() { moveAcross(); }
+    void Timer8_Tick() { moveDown(); }
     // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
-    void tickOnceIfNone();
-    // The pointer was lost or the page went: what is in hand is let go as by its MouseUp.
-    void stopHolds();
+    void tickOnceIfNone() { m_held.tickOnceIfNone(); }
 
-    // Dragging the picture. Positions may lie outside the paper.
-    void PicPic_MouseDown(QPointF at);
-    void PicPic_MouseMove(QPointF at); // also without a drag: hides the panels
-    void PicPic_MouseUp();
-    // Dragging the caption by its box, also in positions of the paper.
-    void Labeltext_MouseDown(QPointF at);
-    void Labeltext_MouseMove(QPointF at);
-    void Labeltext_MouseUp();
+    void Image15_Click() { turnQuarterRight(); }
+    void Image18_Click() { turnQuarterLeft(); }
+    void Image27_Click() { turnTo(180); }
+    void VScrollZ_Change(int value) { setBarZoom(value); }
 
-    void VScrollZ_Change(int value);
+    void PicPic_MouseDown(QPointF at) { beginDrag(at); }
+    void PicPic_MouseMove(QPointF at) { drag(at); } // also without a drag: hides the panels
+    void PicPic_MouseUp() { endDrag(); }
+    void Labeltext_MouseDown(QPointF at) { beginCaptionDrag(at); }
+    void Labeltext_MouseMove(QPointF at) { dragCaption(at); }
+    void Labeltext_MouseUp() { endCaptionDrag(); }
 
-    // Tones: grey, sepia, blue, green; back to colour.
-    void Image4_Click();
-    void Image11_Click();
-    void Image12_Click();
-    void Image9_Click();
-    void Image5_Click();
-    void Image13_MouseMove(); // over the button of the tones, or pressed: shows Frame3
-    void Image15_MouseMove(); // over the quarter turn: shows Frame4
+    void Image4_Click() { takeTone(Tone::Grey); }
+    void Image11_Click() { takeTone(Tone::Sepia); }
+    void Image12_Click() { takeTone(Tone::Blue); }
+    void Image9_Click() { takeTone(Tone::Green); }
+    void Image5_Click() { backToColour(); }
+    void Image13_MouseMove() { showTones(); } // over the button of the tones, or pressed
+    void Image15_MouseMove() { showTurns(); } // over the quarter turn
 
-    // Frames.
-    void Combo4_Click(int index);       // a category
-    void Combo2_Click(int index);       // a frame of it
-    void Image20_Click();               // next
-    void Image21_Click();               // previous
-    void Image22_Click();               // puts the chosen frame on the picture
-    void Image28_Click();               // takes it off
-    void Misgerett_Click(bool checked); // shows frames at all
-    // Line frames: style forward and back, colour by the palette.
-    void Command9_Click();
-    void Command18_Click();
-    void pic4Msgrt_MouseMove(QPointF at); // positions of the palette, cells of 33
-    void PicInMsgrt_Click();
+    void Combo4_Click(int index) { chooseCategory(index); }
+    void Combo2_Click(int index) { chooseFrame(index); }
+    void Image20_Click() { nextFrame(); }
+    void Image21_Click() { previousFrame(); }
+    void Image22_Click() { useFrame(); }
+    void Image28_Click() { removeFrame(); }
+    void Misgerett_Click(bool checked) { showFrames(checked); }
+    void Command9_Click() { stepLineStyle(1); }
+    void Command18_Click() { stepLineStyle(-1); }
+    void pic4Msgrt_MouseMove(QPointF at) { moveMarker(at); } // positions of the palette
+    void PicInMsgrt_Click() { takeLineColour(); }
 
     // The crop markers, a display tool: nothing is cut by them.
-    void Command14_Click(); // to the corners of the paper
-    void Command13_Click(); // a preset inset
-    void Command16_Click(); // wider
-    void Command15_Click(); // narrower
+    void Command14_Click() { markCorners(); }
+    void Command13_Click() { markInset(); }
+    void Command16_Click() { widenMarkers(CropFrame::step); }
+    void Command15_Click() { widenMarkers(-CropFrame::step); }
     void CropHandle_MouseDown(CropFrame::Corner corner, QPointF at);
     void CropHandle_MouseMove(QPointF at);
-    void CropHandle_MouseUp();
+    void CropHandle_MouseUp() { m_cropHandle.release(); }
+
+    // The small view that the page of pictures stores, in logical pixels. Null if nothing was drawn since it was taken.
+    Bitmap takeSmallView();
 
     // --- state ---
 
-    Bitmap PicPic;          // what the paper shows, in the scale that was asked for; null while no picture is open
-    PictureSize PicPicSize; // the paper in logical pixels
-    // The view that the page of pictures keeps, in logical pixels, as preview and record have it. Null if nothing was
-    // drawn since it was taken.
-    Bitmap takeSmallView();
+    const tFrmNewControls& controls() const override { return *this; }
     bool pictureOpen() const { return m_open; }
-
-    // The box that marks the caption, in logical pixels of the paper. Its text is blanks that give its length.
-    TextLabelBox LabeltextBox;
-    Caption Labeltext;
-
-    Caption Label10; // the turn
-    Caption Label11; // the zoom
-    Caption Label13; // the record, for the operator
-    Caption Label5;  // how many frames the category has
-    Caption Label6;  // the frame in hand, "3  / "
-    Caption Label4;  // the palette's index
-    int VScrollZ = 100;
-    static constexpr int VScrollZMin = 40;
-    static constexpr int VScrollZMax = 210;
-
-    TextList Combo4List;            // categories
-    TextList Combo2List;            // frames of the category
-    TextList Combo5List;            // line styles
-    Caption Combo4, Combo2, Combo5; // what the boxes say
-    CheckCaption Misgerett;
+    int turnDegrees() const;    // clockwise from upright, -179 to 180
+    int frameOnPicture() const; // its row in Combo2List, -1 for none of them
     // A small picture of a frame of Combo2List, its longer side 160 pixels; null when there is none.
     Bitmap framePicture(int index) const;
-
-    LineFramePalette palette; // pic4Msgrt with its marker PicInMsgrt
-    CropFrame crop;
-
-    Caption Frame3;   // the panel of the tones
-    Caption Frame4;   // the panel of the turns
-    Caption Picture3; // the tools; shown once a picture is open
-    Caption Image19;  // what to do while none is
-    Caption Frame5;   // the spare panel of the operator
-    Caption Title;    // the leaf name of the picture
-
-    std::array<Caption, 11> Image2;
-    int sunkImage2 = -1; // the held button of Image2 that has its border down
-    Caption Image135, Image115, Image125, Image145, Image15, Image16, Image17, Image18, Image27;
-    Caption Image4, Image5, Image9, Image11, Image12, Image13;
-    Caption Image20, Image21, Image22, Image28, Image29;
-    Caption Command2, Command4, Command6, Command8, Command9, Command18, CommandDone;
-    Caption Command10, Command12, Command23, Command24; // the paper sizes
-    Caption Command13, Command14, Command15, Command16; // the crop markers
-
-    bool hintsAsLabels = false; // Image29: a pointer that can't hover reads the hints below the buttons
-
-    static constexpr int holdMilliseconds = 50;
+    // What a button does in one line, for who can't hover.
+    static QString hintLine(const Caption& button);
 
 Q_SIGNALS:
     // The record of the session is to be kept: the page of pictures listens.
@@ -214,48 +165,91 @@ Q_SIGNALS:
     void picked(const QString& path);
 
 private:
-    enum class Tone { Grey, Sepia, Blue, Green };
+    enum class Held { Closer, Further, Darker, Lighter, Right, Left, Up, Down, TurnRight, TurnLeft };
     enum class Release { MouseUp, Lost };
 
+    // The way out of the page, and looking.
+    void pickAnotherPicture();
+    void backToPictures();
+    void turnHints();
+    void choosePaper(const QString& code) { PaperSizeCode = code; }
+    void measureLevels();
+    void lookQuickly();
+    void showTones();
+    void showTurns();
+    void hidePanels();
+    void markCorners();
+    void markInset();
+    void widenMarkers(int pixels);
+
+    // Held buttons, turning, dragging.
+    void beginHold(Held what);
+    void dropHold();
+    void endHold(Release release = Release::MouseUp);
+    void zoomReleased(Release release);
+    void zoom();
+    void brighten();
+    void turn();
+    void moveAcross();
+    void moveDown();
+    void panBy(QPointF distance);
+    void turnQuarterRight();
+    void turnQuarterLeft();
+    void turnTo(std::int16_t code);
+    void setBarZoom(int percent);
+    void beginDrag(QPointF at);
+    void drag(QPointF at);
+    void endDrag();
+
+    // Colours.
+    void changeColours(void (*step)(EditFields& edit));
+    void takeTone(Tone tone);
+    void backToColour();
+    void undoAllEdits();
+    void correctRedEyes();
+
+    // Frames and line frames.
+    void fillFrames(FrameLists::ListFile kind);
+    void fillFramesIfEmpty();
+    void chooseCategory(int index);
+    void chooseFrame(int index);
+    void nextFrame();
+    void previousFrame();
+    void useFrame();
+    void takeFrame();
+    void removeFrame();
+    void showFrames(bool on);
+    const std::optional<Bitmap>& frame(const EditFields& fields);
+    void stepLineStyle(int places);
+    void moveMarker(QPointF at);
+    void takeLineColour();
+
+    // The caption.
+    void writeCaption();
+    void beginCaptionDrag(QPointF at);
+    void dragCaption(QPointF at);
+    void endCaptionDrag();
+    void PlaceTextLabel();
+
+    // Opening, packing, drawing, storing.
     EditFields& edit() const;
     BigPics& surfaces() const;
     EditedPreview* workPicture() const;
     HostPath hostOf(const QString& path) const;
     void tell(const QString& hebrew, const QString& english, const QString& reason) const;
-    void hidePanels();
-
-    void ResetEditorZoom();
     void OpenPictureInEditor();
     bool LoadWorkBitmap(const QString& path);
     bool loadPictureOfRecord();
     void writeWorkFile();
+    void ResetEditorZoom();
     void putHandle(QPointF position);
     void handleToFields();
     void PackEditState();
     void RenderPreview();
     Bitmap drawn(const EditFields& fields);
     void StoreCurrentEdit();
-    void UndoAllEdits();
-    // The two patterns that most controls follow.
-    void packRenderStore();
+    void packRenderStore(); // the two patterns that most controls follow
     void renderPackStore();
-
-    void hold(Ticker& ticker, int step);
-    void dropHold();
-    void endHold(Release release = Release::MouseUp);
-    void zoomReleased(Release release);
-    void panBy(QPointF distance);
-    void setTurn(std::int16_t code);
-    void setGains(float red, float green, float blue);
-    void takeTone(Tone tone);
-
-    void fillFrames(FrameLists::ListFile kind);
-    void fillFramesIfEmpty();
-    void takeFrame();
-    void stepLineStyle(int step);
-    QChar lineFrameLetter() const;
-    const std::optional<Bitmap>& frame(const EditFields& fields);
-    void PlaceTextLabel();
     void showNumbers();
 
     SessionState& m_state;
@@ -278,10 +272,9 @@ private:
 
     QString PaperSizeCode = QStringLiteral("1015");
     std::int16_t PreviewZoom = 100;
-    QString FrameColorLetter;
-    QString FrameStyleDigits;
+    LineFrameChoice m_lineFrame;
 
-    // The frame that was drawn last, by folder and name: it is read once and not at each tick.
+    // The frame that was drawn last, under its folder and name, so that a tick does not read it again.
     QString m_frameKey;
     std::optional<Bitmap> m_frame;
     mutable std::map<QString, Bitmap> m_framePictures;

@@ -1,4 +1,5 @@
 // The editor: the caption, its keyboard and the box by which it is dragged.
+#include "editing/caption/CaptionStep.h"
 #include "editing/caption/mikledet.h"
 #include "editing/editor/tFrmNew.h"
 #include "platform/Platform.h"
@@ -7,30 +8,20 @@
 
 namespace lumora {
 
-void tFrmNew::Command8_Click() {
+void tFrmNew::writeCaption() {
     if (!m_open)
         return;
     stopHolds();
-    EditFields& fields = edit();
-    if (fields.TextOn == 0) {
-        fields.TextFont = QStringLiteral("David");
-        fields.TextFontSize = 24;
-        fields.TextBlue = 30;
-        fields.TextGreen = 255;
-        fields.TextRed = 255;
-        fields.TextX = 100;
-        fields.TextY = 100;
-        fields.TextOn = 1;
+    if (edit().TextOn == 0) {
+        CaptionStep::begin(edit());
         PlaceTextLabel();
     }
-    auto& keyboard = m_chain.load<mikledet>();
-    keyboard.Text1.text = fields.TextBody;
-    keyboard.Check4.checked = fields.TextOn == 1;
-    m_chain.follow(PageId::tFrmNew, Outcome::CaptionWanted);
+    m_chain.load<mikledet>().open(edit().TextBody, edit().TextOn == 1);
+    m_chain.follow(pageId, Outcome::CaptionWanted);
     Q_EMIT changed();
 }
 
-void tFrmNew::Command11_Click() {
+void tFrmNew::takeCaption() {
     if (!m_open)
         return;
     packRenderStore();
@@ -44,20 +35,20 @@ void tFrmNew::PlaceTextLabel() {
     LabeltextBox = TextLabelPlace::boxOf(edit());
 }
 
-void tFrmNew::Labeltext_MouseDown(QPointF at) {
+void tFrmNew::beginCaptionDrag(QPointF at) {
     if (!m_open || !Labeltext.visible)
         return;
     m_labelHandle.put({LabeltextBox.left, LabeltextBox.top});
     m_labelHandle.press(at);
 }
 
-void tFrmNew::Labeltext_MouseMove(QPointF at) {
+void tFrmNew::dragCaption(QPointF at) {
     if (!m_labelHandle.held())
         return;
     m_labelHandle.move(at);
     LabeltextBox.left = m_labelHandle.position().x();
     LabeltextBox.top = m_labelHandle.position().y();
-    // The letters follow the finger; the fields follow when it is lifted.
+    // Only a copy of the fields follows the finger; the record waits until it is lifted.
     EditFields meanwhile = edit();
     const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, meanwhile);
     meanwhile.TextX = static_cast<std::int16_t>(anchor.x());
@@ -66,8 +57,8 @@ void tFrmNew::Labeltext_MouseMove(QPointF at) {
     Q_EMIT changed();
 }
 
-// Stored without packing: the record takes the new place at the next pack, as the lab's own editor does.
-void tFrmNew::Labeltext_MouseUp() {
+// The caption is stored without packing: the record takes its new place at the next pack.
+void tFrmNew::endCaptionDrag() {
     if (!m_labelHandle.held())
         return;
     m_labelHandle.release();

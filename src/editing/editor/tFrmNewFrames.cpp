@@ -23,8 +23,8 @@ void tFrmNew::fillFrames(FrameLists::ListFile kind) {
     Combo2.text = EditRecord::frameOfBorder(m_state.shemot.Bord.left(2));
 }
 
-// Another category to choose from; the frame on the picture stays.
-void tFrmNew::Combo4_Click(int index) {
+// The customer looks at another category; the frame on the picture stays.
+void tFrmNew::chooseCategory(int index) {
     Combo4List.setCurrentIndex(index);
     Combo4.text = Combo4List.currentItem();
     fillFrames(FrameLists::ListFile::Bmp);
@@ -33,10 +33,10 @@ void tFrmNew::Combo4_Click(int index) {
 
 void tFrmNew::fillFramesIfEmpty() {
     if (Combo2List.isEmpty() && !Combo4List.isEmpty())
-        Combo4_Click(std::max(Combo4List.currentIndex(), 0));
+        chooseCategory(std::max(Combo4List.currentIndex(), 0));
 }
 
-void tFrmNew::Combo2_Click(int index) {
+void tFrmNew::chooseFrame(int index) {
     Combo2List.setCurrentIndex(index);
     if (Combo2List.currentIndex() < 0)
         return;
@@ -54,43 +54,39 @@ void tFrmNew::takeFrame() {
     edit().FrameName = Combo2.text;
 }
 
-void tFrmNew::Image20_Click() {
+void tFrmNew::nextFrame() {
     fillFramesIfEmpty();
     if (Combo2List.currentIndex() < Combo2List.lastIndex())
-        Combo2_Click(Combo2List.currentIndex() + 1);
+        chooseFrame(Combo2List.currentIndex() + 1);
 }
 
-void tFrmNew::Image21_Click() {
+void tFrmNew::previousFrame() {
     fillFramesIfEmpty();
     if (Combo2List.currentIndex() >= 1)
-        Combo2_Click(Combo2List.currentIndex() - 1);
+        chooseFrame(Combo2List.currentIndex() - 1);
 }
 
-void tFrmNew::Image22_Click() {
+void tFrmNew::useFrame() {
     fillFramesIfEmpty();
     if (!m_open)
         return;
     takeFrame();
     if (edit().FrameName == EditRecord::noFrame && !Combo2List.isEmpty())
-        Combo2_Click(0);
+        chooseFrame(0);
     Misgerett.checked = true;
     packRenderStore();
 }
 
-QChar tFrmNew::lineFrameLetter() const {
-    return FrameColorLetter.isEmpty() ? QChar(u'W') : FrameColorLetter.front();
-}
-
-void tFrmNew::Image28_Click() {
+void tFrmNew::removeFrame() {
     if (!m_open)
         return;
-    edit().LineFrameCode = lineFrameLetter() + QStringLiteral("00");
+    edit().LineFrameCode = m_lineFrame.removedCode();
     edit().FrameName = EditRecord::frameRemoved;
     packRenderStore();
 }
 
-void tFrmNew::Misgerett_Click(bool checked) {
-    Misgerett.checked = checked;
+void tFrmNew::showFrames(bool on) {
+    Misgerett.checked = on;
     if (m_open)
         RenderPreview();
     Q_EMIT changed();
@@ -104,6 +100,12 @@ const std::optional<Bitmap>& tFrmNew::frame(const EditFields& fields) {
                                     : std::nullopt;
     }
     return m_frame;
+}
+
+int tFrmNew::frameOnPicture() const {
+    const EditFields& fields = m_state.edit;
+    const bool ofCategory = m_open && fields.FrameFolder.trimmed() == Combo4.text;
+    return ofCategory ? Combo2List.find(fields.FrameName.trimmed()) : -1;
 }
 
 Bitmap tFrmNew::framePicture(int index) const {
@@ -122,36 +124,25 @@ Bitmap tFrmNew::framePicture(int index) const {
     return m_framePictures[path] = picture;
 }
 
-// --- line frames: carried by the record, painted nowhere ---
+// --- line frames: the record carries them to the lab, and nothing here draws them ---
 
-void tFrmNew::stepLineStyle(int step) {
-    const int next = Combo5List.currentIndex() + step;
-    if (!m_open || Combo5List.isEmpty() || next < -1)
+void tFrmNew::stepLineStyle(int places) {
+    if (!m_open || !m_lineFrame.step(places))
         return;
-    // At either end the style stays and is taken once more.
-    Combo5List.setCurrentIndex(std::clamp(next, 0, Combo5List.lastIndex()));
+    Combo5List.setCurrentIndex(m_lineFrame.style());
     Combo5.text = Combo5List.currentItem();
-    FrameStyleDigits = Combo5.text.rightJustified(2, u'0');
-    edit().LineFrameCode = lineFrameLetter() + FrameStyleDigits;
+    edit().LineFrameCode = m_lineFrame.code();
     packRenderStore();
 }
 
-void tFrmNew::Command9_Click() {
-    stepLineStyle(1);
-}
-
-void tFrmNew::Command18_Click() {
-    stepLineStyle(-1);
-}
-
-void tFrmNew::pic4Msgrt_MouseMove(QPointF at) {
+void tFrmNew::moveMarker(QPointF at) {
     palette.moveTo(at);
     Label4.text = QString::number(palette.index());
     Q_EMIT changed();
 }
 
-void tFrmNew::PicInMsgrt_Click() {
-    FrameColorLetter = palette.letter();
+void tFrmNew::takeLineColour() {
+    m_lineFrame.takeColour(palette.letter());
 }
 
 } // namespace lumora

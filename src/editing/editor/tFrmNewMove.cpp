@@ -10,32 +10,56 @@
 #include <algorithm>
 
 namespace lumora {
-namespace {
-
-constexpr int zoomIn = 0;
-constexpr int zoomOut = 1;
-constexpr int darker = 3;
-constexpr int lighter = 4;
-
-constexpr int zoomStep = 2;
-constexpr int brightnessStep = 4; // hundredths of a gain
-constexpr int turnStep = 1;
-constexpr int panStep = 2;
-
-} // namespace
-
 // --- held buttons ---
 
-void tFrmNew::hold(Ticker& ticker, int step) {
+void tFrmNew::beginHold(Held what) {
+    constexpr int zoomStep = 2;
+    constexpr int brightnessStep = 4; // hundredths of a gain
+    constexpr int turnStep = 1;
+    constexpr int panStep = 2;
     stopHolds(); // a second finger takes over
     if (!m_open)
         return;
-    m_step = step;
-    m_held.press(ticker);
+    const auto begin = [this](Ticker& ticker, int step) {
+        m_step = step;
+        m_held.press(ticker);
+    };
+    switch (what) {
+    case Held::Closer:
+        begin(Timer2, zoomStep);
+        break;
+    case Held::Further:
+        begin(Timer2, -zoomStep);
+        break;
+    case Held::Darker:
+        begin(Timer3, -brightnessStep);
+        break;
+    case Held::Lighter:
+        begin(Timer3, brightnessStep);
+        break;
+    case Held::Right:
+        begin(Timer7, panStep);
+        break;
+    case Held::Left:
+        begin(Timer7, -panStep);
+        break;
+    case Held::Up:
+        begin(Timer8, -panStep);
+        break;
+    case Held::Down:
+        begin(Timer8, panStep);
+        break;
+    case Held::TurnRight:
+        begin(Timer6, turnStep);
+        break;
+    case Held::TurnLeft:
+        begin(Timer6, -turnStep);
+        break;
+    }
     Q_EMIT changed();
 }
 
-// Without what a MouseUp does besides: the fields may be those of another picture by now.
+// Nothing is stored here, since the fields may be those of another picture by now.
 void tFrmNew::dropHold() {
     m_held.release();
     sunkImage2 = -1;
@@ -58,38 +82,34 @@ void tFrmNew::endHold(Release release) {
 
 void tFrmNew::stopHolds() {
     endHold(Release::Lost);
-    if (m_labelHandle.held())
-        Labeltext_MouseUp();
-    if (Image3.held())
-        PicPic_MouseUp();
+    endCaptionDrag();
+    endDrag();
     m_cropHandle.release();
 }
 
-void tFrmNew::tickOnceIfNone() {
-    m_held.tickOnceIfNone();
-}
-
 void tFrmNew::Image2_MouseDown(int index) {
-    if (index == zoomIn || index == zoomOut)
-        hold(Timer2, index == zoomIn ? zoomStep : -zoomStep);
-    else if (index == darker || index == lighter)
-        hold(Timer3, index == lighter ? brightnessStep : -brightnessStep);
-    else
+    switch (index) {
+    case 0:
+        beginHold(Held::Closer);
+        break;
+    case 1:
+        beginHold(Held::Further);
+        break;
+    case 3:
+        beginHold(Held::Darker);
+        break;
+    case 4:
+        beginHold(Held::Lighter);
+        break;
+    default:
         return;
+    }
     if (m_held.isHeld())
         sunkImage2 = index;
 }
 
-void tFrmNew::Image2_MouseUp(int) {
-    endHold();
-}
-
-void tFrmNew::Image2_MouseMove() {
-    hidePanels();
-}
-
-// Packing and storing wait for the release: drawing alone is what the eye needs meanwhile.
-void tFrmNew::Timer2_Tick() {
+// The record is packed and stored when the button is let go.
+void tFrmNew::zoom() {
     if (!m_held.ticks(Timer2))
         return;
     PreviewZoom = EditStep::zoom(PreviewZoom, m_step);
@@ -109,7 +129,7 @@ void tFrmNew::zoomReleased(Release release) {
     StoreCurrentEdit();
 }
 
-void tFrmNew::Timer6_Tick() {
+void tFrmNew::turn() {
     if (!m_held.ticks(Timer6))
         return;
     edit().RotationCode = EditStep::turn(edit().RotationCode, m_step);
@@ -117,16 +137,14 @@ void tFrmNew::Timer6_Tick() {
     renderPackStore();
 }
 
-void tFrmNew::Timer7_Tick() {
-    if (!m_held.ticks(Timer7))
-        return;
-    panBy(QPointF(m_step, 0));
+void tFrmNew::moveAcross() {
+    if (m_held.ticks(Timer7))
+        panBy(QPointF(m_step, 0));
 }
 
-void tFrmNew::Timer8_Tick() {
-    if (!m_held.ticks(Timer8))
-        return;
-    panBy(QPointF(0, m_step));
+void tFrmNew::moveDown() {
+    if (m_held.ticks(Timer8))
+        panBy(QPointF(0, m_step));
 }
 
 void tFrmNew::panBy(QPointF distance) {
@@ -135,33 +153,9 @@ void tFrmNew::panBy(QPointF distance) {
     packRenderStore();
 }
 
-void tFrmNew::Image135_MouseDown() {
-    hold(Timer7, panStep);
-}
-
-void tFrmNew::Image115_MouseDown() {
-    hold(Timer7, -panStep);
-}
-
-void tFrmNew::Image125_MouseDown() {
-    hold(Timer8, -panStep);
-}
-
-void tFrmNew::Image145_MouseDown() {
-    hold(Timer8, panStep);
-}
-
-void tFrmNew::Image16_MouseDown() {
-    hold(Timer6, turnStep);
-}
-
-void tFrmNew::Image17_MouseDown() {
-    hold(Timer6, -turnStep);
-}
-
 // --- turning by clicks ---
 
-void tFrmNew::setTurn(std::int16_t code) {
+void tFrmNew::turnTo(std::int16_t code) {
     if (!m_open)
         return;
     edit().RotationCode = code;
@@ -169,26 +163,22 @@ void tFrmNew::setTurn(std::int16_t code) {
     packRenderStore();
 }
 
-void tFrmNew::Image15_Click() {
-    setTurn(EditStep::quarterRight(edit().RotationCode));
+void tFrmNew::turnQuarterRight() {
+    turnTo(EditStep::quarterRight(edit().RotationCode));
 }
 
-void tFrmNew::Image18_Click() {
-    setTurn(EditStep::quarterLeft(edit().RotationCode));
-}
-
-void tFrmNew::Image27_Click() {
-    setTurn(180);
+void tFrmNew::turnQuarterLeft() {
+    turnTo(EditStep::quarterLeft(edit().RotationCode));
 }
 
 // --- dragging the picture ---
 
-void tFrmNew::PicPic_MouseDown(QPointF at) {
+void tFrmNew::beginDrag(QPointF at) {
     if (m_open)
         Image3.press(at);
 }
 
-void tFrmNew::PicPic_MouseMove(QPointF at) {
+void tFrmNew::drag(QPointF at) {
     const Page* front = m_chain.front();
     if (front != nullptr && front->id() == PageId::mikledet)
         return;
@@ -197,7 +187,7 @@ void tFrmNew::PicPic_MouseMove(QPointF at) {
         return;
     Image3.move(at);
     putHandle(Image3.position());
-    // The paper follows the finger; fields and record follow when it is lifted.
+    // Only a copy of the fields follows the finger; the record waits until it is lifted.
     EditFields meanwhile = edit();
     meanwhile.PanX = HoldIn16Bits(Image3.position().x());
     meanwhile.PanY = HoldIn16Bits(Image3.position().y());
@@ -205,7 +195,7 @@ void tFrmNew::PicPic_MouseMove(QPointF at) {
     Q_EMIT changed();
 }
 
-void tFrmNew::PicPic_MouseUp() {
+void tFrmNew::endDrag() {
     if (!Image3.held())
         return;
     Image3.release();
@@ -213,9 +203,9 @@ void tFrmNew::PicPic_MouseUp() {
     packRenderStore();
 }
 
-// The drawing reads ZoomPercent, so that the bar leaves the picture as it is; the next held zoom goes on from here.
-void tFrmNew::VScrollZ_Change(int value) {
-    VScrollZ = std::clamp(value, VScrollZMin, VScrollZMax);
+// The bar leaves the picture as it is, since the drawing reads ZoomPercent; the next held zoom starts from the bar.
+void tFrmNew::setBarZoom(int percent) {
+    VScrollZ = std::clamp(percent, VScrollZMin, VScrollZMax);
     PreviewZoom = HoldIn16Bits(VScrollZ);
     showNumbers();
     if (m_open)

@@ -95,8 +95,33 @@ void tFrmNew::setTexts() {
     Command23.text = QStringLiteral("15/21");
     set(Frame3, u"גוונים", u"Tones");
     set(Frame4, u"סיבוב", u"Turn");
+    words.place = m_state.wording(u"גודל ומקום", u"Size and place");
+    words.turn = m_state.wording(u"סיבוב", u"Turn");
+    words.light = m_state.wording(u"אור וצבע", u"Light and colour");
+    words.frames = m_state.wording(u"מסגרות", u"Frames");
+    words.fineTurn = m_state.wording(u"סיבוב עדין", u"Fine turn");
+    words.closeHints = m_state.wording(u"סגור", u"Close");
+    words.categories = m_state.wording(u"קטגוריית המסגרות", u"Category of frames");
+    words.framesOfCategory = m_state.wording(u"המסגרות של הקטגוריה", u"Frames of the category");
+    words.operatorPanel = QStringLiteral("Operator");
+    words.lineStyles = QStringLiteral("Line style");
+    words.emptyCell = m_state.wording(u"תא ריק", u"Empty place");
+    words.openCell = m_state.wording(u"%1, פתוחה לעריכה", u"%1, open for editing");
+    words.otherCell = m_state.wording(u"%1, לחץ לעריכה", u"%1, press to edit");
     set(Image19, u"בחר תמונה בדף התמונות", u"Choose a picture on the page of pictures");
     Q_EMIT changed();
+}
+
+// The long press stands in brackets: two signs of equality are no words.
+QString tFrmNew::hintLine(const Caption& button) {
+    QString hint = button.hint.simplified();
+    if (const qsizetype held = hint.indexOf(u'='); held >= 0) {
+        QString press = hint.mid(held);
+        press.remove(u'=');
+        hint = hint.left(held).trimmed() + QStringLiteral(" (") + press.simplified() + u')';
+    }
+    const QString name = button.text.simplified();
+    return hint.isEmpty() || hint == name ? name : name + QStringLiteral(": ") + hint;
 }
 
 } // namespace lumora

@@ -122,7 +122,7 @@ PatchStats patchStats(const Bitmap& patch) {
 }
 
 void fixAround(Bitmap& patch, QPoint centre, const Peak& peak) {
-    // 460 steps of a sixtieth: a little more than a full turn, so that the circle closes.
+    // 460 steps of a sixtieth of a radian: a little more than a full turn, so that the circle closes.
     constexpr int steps = 460;
     for (int radius = 0; radius <= patch.height() / 2; ++radius) {
         for (int step = 1; step <= steps; ++step) {

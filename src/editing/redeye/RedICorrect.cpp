@@ -1,10 +1,7 @@
-// The corrections of the red-eye page: what works on pixels.
-
+// The red-eye page: its corrections, and what the operator reads of them.
 #include "editing/redeye/RedI.h"
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
-#include "editing/redeye/RedOverview.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -12,169 +9,103 @@
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 
-#include <QPainter>
-
-#include <cmath>
+#include <algorithm>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-constexpr int deeper = 10;
-constexpr int besidePatch = 40;
-constexpr int passesByHand = 3;
-constexpr int passesAtPoint = 4;
-
-void paintOver(Bitmap& picture, QPoint at, const Bitmap& part) {
-    QPainter painter(&picture.image());
-    painter.setCompositionMode(QPainter::CompositionMode_Source);
-    painter.drawImage(at, part.image());
-}
-
-} // namespace
-
 void RedI::RedFix(int level) {
-    if (!canCorrect() || !keepUndoCopy(circle()))
+    if (!canCorrect() || !keepUndoCopy(m_sight.circle()))
         return;
-    RedFixLevel = HoldIn16Bits(level);
+    m_picture.RedFixLevel = HoldIn16Bits(level);
     correct();
-    RedFixLevel = 0;
-    markChanged();
+    m_picture.RedFixLevel = 0;
+    markCorrected();
 }
 
-void RedI::amok_Click() {
+// The level stays: each press goes deeper.
+void RedI::deepen() {
+    constexpr int deeper = 10;
     kofez.visible = false;
-    if (!canCorrect() || !keepUndoCopy(circle())) {
+    if (!canCorrect() || !keepUndoCopy(m_sight.circle())) {
         showState();
         return;
     }
-    // The level stays: each press goes deeper.
-    RedFixLevel = HoldIn16Bits(RedFixLevel + deeper);
+    m_picture.RedFixLevel = HoldIn16Bits(m_picture.RedFixLevel + deeper);
     correct();
     showLevel();
-    markChanged();
+    markCorrected();
 }
 
-void RedI::Image16_Click() {
-    amok_Click();
+void RedI::deepenAndClean() {
+    deepen();
     CleanList();
 }
 
+void RedI::fixFromMenu(int level) {
+    kofez_Close();
+    RedFix(level);
+}
+
 void RedI::correct() {
-    Frame6.visible = false;
-    Command13_Click();
     takePatch();
     m_drag.release();
-    List1.append(RedEye::correct(Picture1, patchPlace, m_peak.ratio(), RedFixLevel));
+    List1.append(m_picture.correct(m_sight.centre()));
     Image1.visible = false;
-    Picture7 = Bitmap(Picture1.image().copy(patchPlace));
-    Picture2 = Picture7;
-    refreshOverview(patchPlace);
+    showPeak();
     Frame6.visible = true;
     showCounts();
 }
 
-void RedI::Command13_Click() {
+void RedI::findPeak() {
     if (!ready())
         return;
-    m_peak = RedEye::findPeak(Picture1, {RedSearchX, RedSearchY});
-    RedPeakValue = m_peak.redness;
-    RedPeakX = m_peak.x;
-    RedPeakY = m_peak.y;
-    RedPeakBrightness = m_peak.brightness;
-    Label25.text = QString::number(m_peak.redness);
-    Label30.text = QString::number(m_peak.redness - m_peak.brightness);
-    Label31.text = QString::number(m_peak.ratio(), 'g', 15);
-    Q_EMIT changed();
+    m_picture.findPeak(m_sight.centre());
+    showPeak();
 }
 
 void RedI::takePatch() {
-    if (patchPlace != circle())
+    constexpr int besidePatch = 40;
+    if (m_picture.takePatch(m_sight.circle()))
         forgetLists(); // its points are those of another patch
-    patchPlace = circle();
-    Image1Picture = Bitmap(Picture1.image().copy(patchPlace));
-    Picture7 = Image1Picture;
+    const QRect patch = m_picture.patchPlace;
+    Frame6.visible = false;
+    Frame6Place = {patch.left() + patch.width() + besidePatch, patch.top() - besidePatch};
     Image1.visible = true;
-    Frame6Place = {patchPlace.left() + patchPlace.width() + besidePatch, patchPlace.top() - besidePatch};
 }
 
-void RedI::putPatchBack() {
-    paintOver(Picture1, patchPlace.topLeft(), Picture7);
-    Picture2 = Picture7;
-    refreshOverview(patchPlace);
+void RedI::correctByHand() {
+    constexpr int passes = 3;
+    correctByHand(passes, QPoint(m_sight.circleSize / 2, m_sight.circleSize / 2));
 }
 
-void RedI::Command3_Click() {
-    fixByHand(passesByHand, std::nullopt);
-}
-
-void RedI::Image1_MouseUp() {
-    fixByHand(passesByHand, std::nullopt);
-}
-
-void RedI::Image1_MouseDown(Button button, QPointF at) {
-    if (button == Button::Right)
-        fixByHand(passesAtPoint, QPoint(static_cast<int>(std::floor(at.x())), static_cast<int>(std::floor(at.y()))));
-}
-
-void RedI::fixByHand(int passes, std::optional<QPoint> centre) {
+void RedI::correctByHand(int passes, QPoint meant) {
     kofez.visible = false;
-    if (!canCorrect() || !keepUndoCopy(circle())) {
+    if (!canCorrect() || !keepUndoCopy(m_sight.circle())) {
         showState();
         return;
     }
-    Frame6.visible = false;
     takePatch();
-    for (int pass = 0; pass < passes; ++pass) {
-        takeStats();
-        // The first pass goes round the point that was meant, the later ones round the strongest pixel.
-        if (pass == 0) {
-            const QPoint meant = centre.value_or(QPoint(Picture7.width() / 2, Picture7.height() / 2));
-            RedPeakX = meant.x();
-            RedPeakY = meant.y();
-        }
-        RedEye::fixAround(Picture7, {RedPeakX, RedPeakY}, {RedPeakValue, RedPeakX, RedPeakY, RedPeakBrightness});
-    }
-    Image1.visible = false;
-    putPatchBack();
-    markChanged();
-}
-
-void RedI::takeStats() {
-    const RedEye::PatchStats stats = RedEye::patchStats(Picture7);
+    const RedEye::PatchStats stats = m_picture.correctByHand(passes, meant);
     Label13.text = QString::number(stats.peak.redness);
-    if (stats.peak.redness > 0) {
-        RedPeakValue = stats.peak.redness;
-        RedPeakX = stats.peak.x;
-        RedPeakY = stats.peak.y;
-        RedPeakBrightness = stats.peak.brightness;
-    }
     Label16.text = PlainNumber(static_cast<float>(stats.averageRedness));
     Label17.text = PlainNumber(static_cast<float>(stats.averageBrightness));
+    Image1.visible = false;
+    markCorrected();
 }
 
-void RedI::HScroll1_Change(int value) {
+void RedI::setLevel(int tens) {
     if (!ready() || !keepUndoCopy({}))
         return;
-    HScroll1 = std::clamp(value, 0, HScroll1Max);
-    RedFixLevel = HoldIn16Bits(HScroll1 * 10);
+    HScroll1 = std::clamp(tens, 0, HScroll1Max);
+    m_picture.RedFixLevel = HoldIn16Bits(HScroll1 * 10);
     showLevel();
-    RedChanged = true;
+    m_picture.markChanged();
     showState();
 }
 
 // Darkening
-
-void RedI::Image6_Click() {
-    Image6_MouseMove();
-    darken();
-}
-
-void RedI::Frame6_Click() {
-    darken();
-}
 
 void RedI::darken() {
     if (!ready())
@@ -182,23 +113,24 @@ void RedI::darken() {
     CleanList();
     if (List2.isEmpty())
         return;
-    RedEye::darken(Picture7, Picture7.image().rect(), List2.items());
-    m_undo.changedOtherwise(patchPlace & Picture1.image().rect());
-    putPatchBack();
+    m_picture.darken(List2.items());
     showState();
 }
 
-void RedI::Image6_MouseMove() {
-    Label45.visible = true;
-    Frame6.visible = false;
-    Timer7.start();
-    Q_EMIT changed();
+void RedI::darkenWithNotice() {
+    tellWhenToDarken();
+    darken();
 }
 
-void RedI::Timer7_Tick() {
+void RedI::tellWhenToDarken() {
+    Frame6.visible = false;
+    Timer7.start();
+    show(Label45, true);
+}
+
+void RedI::hideNotice() {
     Timer7.stop();
-    Label45.visible = false;
-    Q_EMIT changed();
+    show(Label45, false);
 }
 
 void RedI::CleanList() {
@@ -216,140 +148,79 @@ void RedI::forgetLists() {
 // Going back
 
 bool RedI::keepUndoCopy(const QRect& part) {
-    const QRect inside = part & Picture1.image().rect();
     const Result<void> folders = Workspace(m_state, m_platform.files).MakeWorkspace();
-    const auto keep = [&] { return folders ? m_undo.keep(Picture1, inside) : folders; };
-    // Who is quicker than the disk waits for it, and is told so.
+    const auto keep = [&] { return folders ? m_picture.keep(part) : folders; };
+    // The undo copy may still be under way: the customer waits for it and is told.
     Result<void> kept;
-    if (m_undo.isReady()) {
+    if (m_picture.isReady()) {
         kept = keep();
     } else {
         waitFor(m_state.wording(u"רגע אחד, נשמר עותק לביטול…"_s, u"One moment, keeping a copy for undo…"_s));
         kept = RunBlocking(keep);
-        busy = false;
-        Label4Busy.visible = false;
+        endWait();
         showState();
     }
-    if (!kept) {
-        m_platform.dialogs.message(m_state
-                                       .wording(u"לא ניתן לשמור עותק לביטול, ולכן התיקון לא נעשה.\n%1"_s,
-                                                u"No copy for undo can be kept, so the correction was not made.\n%1"_s)
-                                       .arg(kept.failure().message));
-        return false;
-    }
-    m_changedBefore = RedChanged;
-    // What the customer's file holds there, so that all corrections can be cancelled without reading it again.
-    for (const QRect& fresh : QRegion(inside) - m_corrected)
-        m_originals.emplace_back(fresh.topLeft(), Bitmap(Picture1.image().copy(fresh)));
-    m_corrected += inside;
-    return true;
+    if (!kept)
+        tellFailure(u"לא ניתן לשמור עותק לביטול, ולכן התיקון לא נעשה.\n%1"_s,
+                    u"No copy for undo can be kept, so the correction was not made.\n%1"_s, kept.failure());
+    return kept.ok();
 }
 
-void RedI::Image7_Click() {
-    if (!ready() || !m_undo.canRestore())
+void RedI::goBack() {
+    if (!ready() || !m_picture.canGoBack())
         return;
-    const Result<QRegion> restored = m_undo.restore(Picture1);
-    if (!restored) {
-        m_platform.dialogs.message(m_state.wording(u"לא ניתן לבטל את הצעד.\n%1"_s, u"The step can't be undone.\n%1"_s)
-                                       .arg(restored.failure().message));
-        return;
-    }
-    RedChanged = m_changedBefore;
-    afterGoingBack(*restored);
+    if (const Result<void> back = m_picture.goBack(); !back)
+        tellFailure(u"לא ניתן לבטל את הצעד.\n%1"_s, u"The step can't be undone.\n%1"_s, back.failure());
+    else
+        afterGoingBack();
 }
 
-void RedI::Rstor_Click() {
+void RedI::cancelAll() {
     kofez.visible = false;
-    if (caption == notChosen || !ready())
+    if (!ready())
         return;
-    for (const auto& [at, original] : m_originals)
-        paintOver(Picture1, at, original);
-    m_undo.changedOtherwise(m_corrected);
-    RedChanged = false;
-    afterGoingBack(m_corrected);
+    m_picture.cancelAll();
+    afterGoingBack();
 }
 
-// The patch in work belongs to a correction that is no more.
-void RedI::afterGoingBack(const QRegion& changedPart) {
+void RedI::afterGoingBack() {
     stopHolds();
-    for (const QRect& rect : changedPart)
-        refreshOverview(rect);
     forgetLists();
-    RedFixLevel = 0;
     showLevel();
     Frame6.visible = false;
-    Picture7 = Picture2 = Bitmap();
-    patchPlace = {};
     m_step = RedTargetRectangle.visible ? Step::Aim : Step::FindEye;
     setTexts();
 }
 
-void RedI::markChanged() {
-    RedChanged = true;
+void RedI::markCorrected() {
+    m_picture.markChanged();
     m_step = Step::Corrected;
     setTexts();
 }
 
-void RedI::refreshOverview(const QRect& changedPart) {
-    RedOverview::refresh(Picture3, Picture1, changedPart);
-}
-
-// The menu
+// The menu and the instructions
 
 void RedI::kofez_Open() {
     if (!ready())
         return;
     stopHolds();
-    kofez.visible = true;
-    Q_EMIT changed();
-}
-
-void RedI::kofez_Close() {
-    kofez.visible = false;
-    Q_EMIT changed();
+    show(kofez, true);
 }
 
 void RedI::CommandHelp_Click() {
     stopHolds();
-    FrameHelp.visible = true;
-    Q_EMIT changed();
-}
-
-void RedI::CommandHelpClose_Click() {
-    FrameHelp.visible = false;
-    Q_EMIT changed();
-}
-
-void RedI::fixFromMenu(int level) {
-    kofez_Close();
-    RedFix(level);
-}
-
-void RedI::Bsisi_Click() {
-    fixFromMenu(0);
-}
-
-void RedI::amok2_Click() {
-    fixFromMenu(15);
-}
-
-void RedI::amok3_Click() {
-    fixFromMenu(30);
-}
-
-void RedI::amok4_Click() {
-    fixFromMenu(45);
-}
-
-void RedI::amok5_Click() {
-    fixFromMenu(65);
-}
-
-void RedI::Memokad_Click() {
-    kofez_Close();
+    show(FrameHelp, true);
 }
 
 // For the operator
+
+void RedI::showPeak() {
+    const RedEye::Peak& peak = m_picture.peak;
+    Label25.text = QString::number(peak.redness);
+    Label30.text = QString::number(peak.redness - peak.brightness);
+    Label31.text = QString::number(peak.ratio(), 'g', 15);
+    Q_EMIT changed();
+}
 
 void RedI::showPixel(QRgb pixel, QPoint at) {
     const int redness = RedEye::redness(pixel);
@@ -363,20 +234,25 @@ void RedI::showPixel(QRgb pixel, QPoint at) {
     Label12.text = QString::number(brightness);
     Label24.text = QString::number(redness - brightness);
     Label27.text = PlainNumber(static_cast<float>(redness) / std::max(1, brightness));
-    Label28.text = PlainNumber(static_cast<float>(m_peak.ratio() * 7 - RedFixLevel));
+    Label28.text = PlainNumber(static_cast<float>(m_picture.peak.ratio() * 7 - m_picture.RedFixLevel));
     Q_EMIT changed();
 }
 
-void RedI::Picture7_MouseMove(QPointF at) {
-    const QPoint pixel(static_cast<int>(std::floor(at.x())), static_cast<int>(std::floor(at.y())));
-    if (!Picture7.image().valid(pixel))
+void RedI::readPatch(QPoint pixel) {
+    if (!m_picture.Picture7.image().valid(pixel))
         return;
-    const QRgb value = Picture7.image().pixel(pixel);
-    showPixel(value, pixel + patchPlace.topLeft());
+    const QRgb value = m_picture.Picture7.image().pixel(pixel);
+    showPixel(value, pixel + m_picture.patchPlace.topLeft());
     Label6.text = QString::number(RedEye::redness(value));
     Label6Order = Label16.text.isEmpty()                  ? Order::Unknown
                   : Val(Label6.text) >= Val(Label16.text) ? Order::InOrder
                                                           : Order::OutOfOrder;
+}
+
+QString RedI::readings() const {
+    return u"R %1 G %2 B %3 · %4 − %5 = %6 · %7 | %8"_s.arg(
+        Rlbl.text, Glbl.text, Blbl.text, Label3.text, Label12.text, Label24.text, Label28.text,
+        QStringList{Label25.text, Label30.text, Label31.text, Label37.text, Label42.text, Label43.text}.join(u" · "_s));
 }
 
 void RedI::showCounts() {
@@ -385,7 +261,7 @@ void RedI::showCounts() {
 }
 
 void RedI::showLevel() {
-    Label37.text = QString::number(RedFixLevel);
+    Label37.text = QString::number(m_picture.RedFixLevel);
 }
 
 } // namespace lumora

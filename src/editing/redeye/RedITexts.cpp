@@ -80,6 +80,10 @@ void RedI::setTexts() {
     CommandHelp.text = say(u"הסבר", u"Help");
     CommandHelpClose.text = say(u"הבנתי", u"I see");
     FrameHelp.text = say(u"כך מתקנים עין אדומה", u"How to correct a red eye");
+    words.steps = {say(u"הקש על העין", u"Tap the red eye"), say(u"התאם את העיגול", u"Fit the circle"),
+                   say(u"לחץ על תיקון", u"Press Correct"), say(u"אשר את התמונה", u"Accept")};
+    words.picture = say(u"התמונה: %1", u"The picture: %1");
+    words.overview = say(u"התמונה כולה, הקש על העין האדומה", u"The whole picture: tap the red eye");
     Label40.visible = m_step != Step::Corrected;
     Label41.visible = m_step == Step::Aim;
     Label44.visible = m_step == Step::Corrected;
@@ -88,6 +92,10 @@ void RedI::setTexts() {
         button->hint = button->text + hold;
     Image6.hint = Label45.text.simplified();
     showState();
+}
+
+QString RedI::helpText() const {
+    return Label41.text + u'\n' + Label44.text.trimmed() + u'\n' + Label45.text.trimmed();
 }
 
 } // namespace lumora

@@ -8,7 +8,7 @@
 namespace lumora::RedOverview {
 namespace {
 
-// The source pixels from first to before last that pixel index of so many stands for.
+// The source pixels, first to before last, that one pixel of the overview stands for.
 struct Span {
     int first;
     int last;
@@ -64,6 +64,11 @@ PictureSize size(PictureSize picture) {
     return height > 270 ? PictureSize{side(300 * ratio), 300} : PictureSize{250, side(height)};
 }
 
+PictureSize pixels(PictureSize size) {
+    constexpr int density = 2;
+    return {size.width * density, size.height * density};
+}
+
 Bitmap draw(const Bitmap& picture, PictureSize size) {
     Bitmap overview(size.width, size.height, Qt::white);
     if (!picture.isNull() && !overview.isNull())
@@ -75,7 +80,7 @@ void refresh(Bitmap& overview, const Bitmap& picture, const QRect& part) {
     const QRect changed = part & picture.image().rect();
     if (changed.isEmpty() || overview.isNull())
         return;
-    // One pixel further each way: the spans' edges are cut to whole pixels.
+    // Spans are cut to whole pixels, so one pixel more is drawn on each side.
     const auto index = [](int at, int of, int source) {
         return static_cast<int>(static_cast<qint64>(at) * of / source);
     };

@@ -37,7 +37,7 @@ Result<void> RedUndoCopy::finishWriting(const Bitmap& picture) {
         m_writer.join();
     Result<void> written = m_waiting ? commitWaiting() : Failure{};
     if (!written) {
-        // The background found no room or no folder, or lost it since; there may be one by now.
+        // The background writing failed; there may be room and a folder by now.
         m_waiting.emplace(m_file, QString::fromLocal8Bit(m_file.c_str()));
         appendBmp(picture, *m_waiting, [] { return false; });
         m_differs = {};

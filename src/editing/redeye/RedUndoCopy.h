@@ -15,11 +15,10 @@
 
 namespace lumora {
 
-// The one step back of a correction: a file with the whole picture as it was before the latest change. Writing 50
-// megapixels anew for a change of a few thousand pixels would let the customer wait, so the copy is written once, in
-// the background, while the customer looks for the eye; before a later change only the rows of what differs are
-// brought up to date. It comes under its name with the first change, so that a visit without a correction leaves no
-// undo copy, and only what this visit wrote is ever read back.
+// The one step back of a correction: a file with the whole picture as it was before the latest change. The file is
+// written once, in the background, while the customer looks for the eye, since writing 50 megapixels takes seconds;
+// before a later change only the rows that differ are brought up to date. The file gets its name with the first change,
+// so that a visit without a correction leaves no undo copy. Only what this visit wrote is read back.
 class RedUndoCopy {
 public:
     RedUndoCopy() = default;
@@ -33,8 +32,7 @@ public:
     // False while keep() would have to wait for the writing of a whole picture.
     bool isReady() const { return m_rows || (m_written && m_waiting && !m_waiting->failed()); }
 
-    // To be called before the part of the picture changes: the file then holds the picture as it is now. Waits for the
-    // background work if it is still under way.
+    // Brings the file to the picture as it is now, before the part changes. Waits for the background writing.
     Result<void> keep(const Bitmap& picture, const QRect& part);
 
     // The picture was changed in this region by other ways than a change that keep() announced.

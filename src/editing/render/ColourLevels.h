@@ -24,11 +24,11 @@ public:
 
     const std::array<QStringList, 3>& lists() const { return m_lists; }
 
-    // A fifth of 1 and the last five items, and of 1 at least: a black picture has 0.2.
+    // (1 + the sum of the last five items) / 5, so that a black picture has 0.2.
     ChannelValues topLevels() const;
-    // What would bring the top level to full.
+    // The factor that brings the top level to 255.
     ChannelValues gains() const;
-    // So much above the first item.
+    // The first item plus above.
     ChannelValues floors(int above) const;
 
     static QString itemText(int value);

@@ -9,9 +9,9 @@
 
 namespace lumora {
 
-// The corner markers that may be laid over the paper, to look at: neither preview nor print is cut by them. Three
-// corners are free and the fourth follows, so that the four are a parallelogram at any time. Each has a handle, which
-// moves by a drag; its marker follows in the proportion of the two figures.
+// The corner markers that the operator may lay over the paper. Neither preview nor print is cut by them. Three corners
+// are free and the fourth follows, so that the four are always a parallelogram. Each corner has a handle that is
+// dragged; its marker moves in the proportion of marker size to handle size.
 class CropFrame {
 public:
     // Top left, bottom left, top right, and the one that follows.

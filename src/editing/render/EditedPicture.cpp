@@ -24,7 +24,7 @@ ColourMatrix coloursOf(const EditFields& edit) {
     return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
 }
 
-// As the record carries it, so that the editor shows no more than what prints.
+// The caption as the record stores it: a preview never shows more than the print.
 PictureCaption captionOf(const EditFields& edit) {
     namespace R = EditRecord;
     const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
@@ -50,7 +50,7 @@ void drawOver(Bitmap& paper, const KeyedFrame& frame, const CaptionInk& ink) {
     drawInk(paper, ink);
 }
 
-// A part of the picture's own pixels, which have to outlive it.
+// A view of the picture's own pixels; the picture must outlive it.
 Bitmap within(const Bitmap& picture, const QRect& part) {
     const QImage& image = picture.image();
     const QRect area = part & image.rect();
@@ -81,13 +81,13 @@ bool touches(const Placement& placement, PictureSize paper) {
     return right > -1 && bottom > -1 && left < paper.width + 1 && top < paper.height + 1;
 }
 
-// One name and no way out of the folder it is looked up in.
+// True for a plain name that can't lead out of the folder.
 bool isPlainName(const QString& name) {
     return !name.contains(u'/') && !name.contains(u'\\') && !name.contains(u':') &&
            !name.contains(QStringLiteral("..")) && !name.contains(QChar(0)) && name != QStringLiteral(".");
 }
 
-// The labs that make frames see no difference between "k011.bmp" and "K011.BMP".
+// Frame files are found whatever their letter case.
 fs::path fileNamed(const fs::path& folder, const QString& leaf) {
     const fs::path exact = folder / toHostPath(leaf);
     std::error_code error;
@@ -100,8 +100,7 @@ fs::path fileNamed(const fs::path& folder, const QString& leaf) {
     return exact;
 }
 
-// The work picture: shrunk by the averaging cubic, enlarged by a straight line between pixels, as the lab's own editor
-// does when it loads a picture smaller than that.
+// The work picture: a larger file is shrunk by the averaging cubic, a smaller one is enlarged linearly.
 Result<Bitmap> loadWork(const fs::path& file, PictureSize fileSize, PictureSize wanted) {
     if (wanted.width <= fileSize.width && wanted.height <= fileSize.height)
         return loadPictureScaled(file, wanted);
@@ -232,7 +231,7 @@ Bitmap EditedPreview::render(const EditFields& edit, const std::optional<Bitmap>
     if (uncovered && m_overlay.background.isNull())
         m_overlay.background =
             m_colour ? Bitmap(size.width, size.height, *m_colour) : resampled(sourceFor(scale), size);
-    // The stretched picture takes longer than all the rest; as long as nothing of it shows it is not made.
+    // The stretched picture takes longest, so it is made only where something of it shows.
     Bitmap paper = uncovered ? m_overlay.background : Bitmap(size.width, size.height, Qt::white);
     drawPlaced(paper, sourceFor(scale), placement, coloursOf(edit));
     drawOver(paper, m_overlay.frame, m_overlay.ink);
@@ -262,8 +261,7 @@ Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edi
     const bool shows = touches(placement, geometry.size);
     const bool stretched = !print.background && !(shows && placement.covers(geometry.size));
 
-    // One decode serves both: what the placed picture needs, and where it leaves paper uncovered, what the stretched
-    // one needs.
+    // One decode serves the placed picture and the stretched one behind it.
     PictureSize wanted = shows ? reducedSize(*size, placement) : PictureSize{1, 1};
     QRect part = shows ? neededPart(wanted, placement, geometry.size) : QRect(0, 0, 1, 1);
     if (stretched) {

@@ -29,7 +29,7 @@ enum class FrameUse { Preview, Print };
 // "999", and for names that lead out of that folder.
 std::optional<Bitmap> loadFrame(const std::filesystem::path& framesFolder, const EditFields& edit, FrameUse use);
 
-// A picture opened for editing: small enough to be drawn anew at each tick of a held button.
+// A picture opened for editing, small enough to be drawn at each tick of a held button.
 class EditedPreview {
 public:
     // zoomPercent decides the size of the work picture and stays so. The file may be a corrected copy. grey: the
@@ -51,10 +51,9 @@ public:
     // What an uncovered part of the paper shows; without it the whole picture, stretched.
     void setBackground(QColor colour);
 
-    // In the box's size times scale, rounded; every number of pixels in the record is multiplied by it, as the print
-    // does. frame as loadFrame gives it, or none. What a tick leaves as it was is kept for the next one: the stretched
-    // frame as long as the very same bitmap comes (so keep it rather than loading it each time), the caption as
-    // CaptionInks says.
+    // Draws in the box's size times scale, rounded; every number of pixels in the record is multiplied by scale, as in
+    // the print. frame comes from loadFrame. The stretched frame is kept as long as the same bitmap comes, and the
+    // caption as CaptionInks says, so the caller should keep the frame and not load it for each drawing.
     Bitmap render(const EditFields& edit, const std::optional<Bitmap>& frame, double scale = 1);
 
 private:

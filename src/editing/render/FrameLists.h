@@ -7,7 +7,7 @@ namespace lumora {
 
 class Files;
 
-// The frames that lie in the folder of frames: a sub-folder a category, in it "k<name>.bmp", the frame that the preview
+// The frames of the folder of frames. A sub-folder is a category; it holds "k<name>.bmp", the frame that the preview
 // shows, and list files of the bare name. A name that is too long for its field of the record is not offered.
 class FrameLists {
 public:

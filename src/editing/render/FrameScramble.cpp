@@ -27,8 +27,7 @@ Result<QString> ScrambleFrameFile(const SessionState& state, const Files& files,
     const Result<QByteArray> bytes = files.read(path);
     if (!bytes)
         return bytes.failure();
-    // The tools that read the result join three piece files; here the pieces never leave memory, so that nothing is
-    // left half joined.
+    // The pieces never leave memory, so that nothing is left half joined.
     const QString result = results + QStringLiteral("\\!k.bmp");
     if (const Result<void> written =
             files.writeWhole(result, bytes->mid(block, block) + bytes->left(block) + bytes->mid(2 * block));

@@ -25,10 +25,10 @@ public:
 
     int width() const { return m_width; }
 
-    // One path of shapes that lie so far inside the edges of the box; a width of 0 is the thinnest line.
+    // Adds a shape that lies so far inside the edges of the box. Width 0 is the thinnest line.
     void draw(Shape shape, double rectangleInset, double ellipseInset, int alpha, int penWidth) {
         QPainterPath path;
-        // A line of one pixel covers the pixel that it is said to be on.
+        // A line of one pixel covers exactly its pixel.
         const double half = penWidth == 0 ? 0.5 : 0;
         if (shape != Shape::Ellipse)
             path.addRect(inset(rectangleInset).translated(half, half));
@@ -72,7 +72,7 @@ void drawFading(LinePainter& lines, const Fading& fading) {
         lines.draw(fading.shape, i, -i, fading.firstAlpha - fading.fall * i, 0);
 }
 
-// From so far inside outwards, with a broad pen.
+// Rectangles from so far inside outwards, with a broad pen.
 template <typename Alpha>
 void drawGrowing(LinePainter& lines, Shape shape, int penWidth, const Alpha& alpha) {
     for (int i = 1; i <= lines.width(); ++i)

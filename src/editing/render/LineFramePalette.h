@@ -21,7 +21,7 @@ public:
     int index() const { return m_index; }
     QRect marker() const;
 
-    // The letter of a cell, as the record carries it; of the one under the marker.
+    // The letter that the record carries for a cell.
     static QChar letterOf(int cellIndex);
     QChar letter() const { return letterOf(m_index); }
 

@@ -29,7 +29,7 @@ Result<void> store(const SessionState& state, const Files& files, const QString&
 
 void discard(const SessionState& state, const Files& files, const QString& picturePath) {
     const QString stored = path(state, picturePath);
-    // One that can't be removed is only a picture; the next store writes over it.
+    // A small view that can't be removed stays until the next store writes over it.
     if (files.fileExists(stored))
         static_cast<void>(files.removeFile(stored));
 }

@@ -13,7 +13,7 @@ using EditRecord::alignCentre;
 using EditRecord::alignFar;
 using EditRecord::runsDown;
 
-// Of the label's own font, in its em: a blank and a line. Its size is in points, 96 pixels to 72 of them.
+// Width of a blank and height of a line of the label's font, in em. A point is 96/72 pixels.
 constexpr double blankWidth = 0.28;
 constexpr double lineHeight = 1.17;
 constexpr double pixelsOfPoint = 96.0 / 72.0;

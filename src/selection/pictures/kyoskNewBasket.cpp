@@ -103,7 +103,7 @@ void kyoskNew::openInEditor(int cell) {
     if (editor() == nullptr)
         return;
     setKeysPlain();
-    editor()->Command17_Click();
+    editor()->openPicture();
     if (!editor()->pictureOpen())
         return; // it was told; the picture stays in the basket as it was
     Command13[static_cast<std::size_t>(cell)].colour = KeyColour::Orange;
@@ -116,7 +116,7 @@ void kyoskNew::openInEditor(int cell) {
 void kyoskNew::leaveEditor() {
     if (editor() != nullptr) {
         editor()->stopHolds();
-        editor()->Command5_Click();
+        editor()->keepRecord();
     }
     Command5_Click();
     repaintStored(m_state.edit.PicturePath);

@@ -294,7 +294,7 @@ void kyoskNew::Image4_Click() {
 void kyoskNew::Picture2_Click() {
     if (Picture2.bitmap.isNull())
         return;
-    m_chain.load<Form3>().showPicture(Label2.text);
+    m_chain.load<Form3>().open(Label2.text);
     m_chain.follow(PageId::kyoskNew, Outcome::TurnedWanted);
 }
 

@@ -99,9 +99,8 @@ void FtpFrm::ShowOrderSummary() {
     Picture2Lines = OrderSummaryLines(m_state, m_platform.clock.now().date());
     if (m_state.transfer.SugMishloah == Sending::Chain || !m_chain.isRegistered(PageId::gdisave))
         return;
-    auto& saver = m_chain.load<gdisave>();
-    saver.LitlPic = OrderSummaryPicture(Picture2Lines, m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
-    saver.Command7_Click();
+    m_chain.load<gdisave>().saveProof(
+        OrderSummaryPicture(Picture2Lines, m_state.english() ? Qt::LeftToRight : Qt::RightToLeft));
 }
 
 void FtpFrm::armCountdown() {

@@ -19,6 +19,7 @@ protected:
 
 private:
     Form3& m_page;
+    const Form3Controls& m_shows;
     PictureBox* m_picture;
     QLabel* m_unreadable;
     QPushButton* m_turn;

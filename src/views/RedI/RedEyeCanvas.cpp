@@ -32,8 +32,8 @@ RedEyeCanvas::RedEyeCanvas(RedI& page, const Theme& theme, QWidget* parent)
 }
 
 QPointF RedEyeCanvas::onWidget(QPointF picture) const {
-    const QPointF corner(m_page.Picture1Left, m_page.Picture1Top);
-    return QRectF(rect()).center() + (corner - RedI::viewingCentre) * m_theme.factor() + picture * scale();
+    const QPointF corner(m_page.sight().Picture1Left, m_page.sight().Picture1Top);
+    return QRectF(rect()).center() + (corner - RedEyeSight::viewingCentre) * m_theme.factor() + picture * scale();
 }
 
 QPointF RedEyeCanvas::inPicture(QPointF widget) const {
@@ -41,7 +41,7 @@ QPointF RedEyeCanvas::inPicture(QPointF widget) const {
 }
 
 QRectF RedEyeCanvas::visiblePart() const {
-    return QRectF(inPicture({}), QSizeF(size()) / scale()) & QRectF(m_page.Picture1.image().rect());
+    return QRectF(inPicture({}), QSizeF(size()) / scale()) & QRectF(m_page.picture().Picture1.image().rect());
 }
 
 void RedEyeCanvas::paintEvent(QPaintEvent*) {
@@ -51,16 +51,16 @@ void RedEyeCanvas::paintEvent(QPaintEvent*) {
     shape.addRoundedRect(rect(), m_theme.corner(), m_theme.corner());
     painter.setClipPath(shape);
     painter.fillRect(rect(), Theme::Colour::Sunken);
-    if (m_page.Picture1.isNull())
+    if (m_page.picture().Picture1.isNull())
         return;
     const QRectF part = visiblePart();
     const auto placed = [this](const QRectF& area) { return QRectF(onWidget(area.topLeft()), area.size() * scale()); };
-    painter.drawImage(placed(part), m_page.Picture1.image(), part);
-    if (m_page.Image1.visible && !m_page.Image1Picture.isNull())
-        painter.drawImage(placed(m_page.patchPlace), m_page.Image1Picture.image());
-    if (!m_page.RedTargetRectangle.visible)
+    painter.drawImage(placed(part), m_page.picture().Picture1.image(), part);
+    if (m_page.controls().Image1.visible && !m_page.picture().Image1Picture.isNull())
+        painter.drawImage(placed(m_page.picture().patchPlace), m_page.picture().Image1Picture.image());
+    if (!m_page.controls().RedTargetRectangle.visible)
         return;
-    const QRectF circle = placed(m_page.circle());
+    const QRectF circle = placed(m_page.sight().circle());
     painter.setBrush(Qt::NoBrush);
     painter.setPen(QPen(Theme::Colour::Ink, m_theme.px(5)));
     painter.drawEllipse(circle);
@@ -102,16 +102,20 @@ void RedEyeCanvas::wheelEvent(QWheelEvent* event) {
 void RedEyeCanvas::keyPressEvent(QKeyEvent* event) {
     switch (event->key()) {
     case Qt::Key_Up:
-        m_page.Timer2_Tick();
+        m_page.Image12_MouseDown();
+        endTap();
         break;
     case Qt::Key_Down:
-        m_page.Timer3_Tick();
+        m_page.Image13_MouseDown();
+        endTap();
         break;
     case Qt::Key_Left:
-        m_page.Timer4_Tick();
+        m_page.Image14_MouseDown();
+        endTap();
         break;
     case Qt::Key_Right:
-        m_page.Timer5_Tick();
+        m_page.Image15_MouseDown();
+        endTap();
         break;
     case Qt::Key_Plus:
     case Qt::Key_Equal:
@@ -126,6 +130,12 @@ void RedEyeCanvas::keyPressEvent(QKeyEvent* event) {
     default:
         QWidget::keyPressEvent(event);
     }
+}
+
+// A key moves the circle as a tap of the button does.
+void RedEyeCanvas::endTap() {
+    m_page.tickOnceIfNone();
+    m_page.Arrow_MouseUp();
 }
 
 void RedEyeCanvas::hideEvent(QHideEvent* event) {
@@ -146,7 +156,8 @@ RedEyeOverview::RedEyeOverview(RedI& page, const Theme& theme, const RedEyeCanva
 
 void RedEyeOverview::fit() {
     constexpr double tallest = 190;
-    const QSizeF logical(std::max(1, m_page.Picture3Size.width), std::max(1, m_page.Picture3Size.height));
+    const QSizeF logical(std::max(1, m_page.picture().Picture3Size.width),
+                         std::max(1, m_page.picture().Picture3Size.height));
     const double share = std::min(1.0, tallest / logical.height());
     const QSize wanted(m_theme.px(std::max(1.0, logical.width() * share)),
                        m_theme.px(std::max(1.0, logical.height() * share)));
@@ -156,13 +167,13 @@ void RedEyeOverview::fit() {
 }
 
 void RedEyeOverview::paintEvent(QPaintEvent*) {
-    if (m_page.Picture3.isNull())
+    if (m_page.picture().Picture3.isNull())
         return;
     QPainter painter(this);
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
-    painter.drawImage(rect(), m_page.Picture3.image());
-    const double across = static_cast<double>(width()) / m_page.Picture1.width();
-    const double down = static_cast<double>(height()) / m_page.Picture1.height();
+    painter.drawImage(rect(), m_page.picture().Picture3.image());
+    const double across = static_cast<double>(width()) / m_page.picture().Picture1.width();
+    const double down = static_cast<double>(height()) / m_page.picture().Picture1.height();
     const auto placed = [&](const QRectF& part) {
         return QRectF(part.left() * across, part.top() * down, part.width() * across, part.height() * down);
     };
@@ -172,9 +183,9 @@ void RedEyeOverview::paintEvent(QPaintEvent*) {
     painter.drawRect(seen);
     painter.setPen(QPen(Theme::Colour::Primary, m_theme.px(2)));
     painter.drawRect(seen);
-    if (!m_page.RedTargetRectangle.visible)
+    if (!m_page.controls().RedTargetRectangle.visible)
         return;
-    QRectF circle = placed(m_page.circle());
+    QRectF circle = placed(m_page.sight().circle());
     const double least = m_theme.px(12);
     if (circle.width() < least) {
         const QPointF middle = circle.center();

@@ -37,8 +37,9 @@ protected:
     void resizeEvent(QResizeEvent* event) override;
 
 private:
-    double scale() const { return m_theme.factor() * m_page.Magnification; }
+    double scale() const { return m_theme.factor() * m_page.sight().Magnification; }
     QPointF inPicture(QPointF widget) const;
+    void endTap();
 
     RedI& m_page;
     const Theme& m_theme;

@@ -37,13 +37,14 @@ QString linesOf(const QString& text) {
 
 RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page) {
+    , m_page(page)
+    , m_shows(page.controls()) {
     frame().steps().setStep(OrderStep::Pictures);
     frame().setTitleVisible(false);
 
     auto* top = new QHBoxLayout;
     top->setSpacing(theme.px(20));
-    auto* title = label(u"LabelTitle"_s, page.LabelTitle, "large");
+    auto* title = label(u"LabelTitle"_s, m_shows.LabelTitle, "large");
     title->setWordWrap(false);
     top->addWidget(title);
     m_steps = new RedEyeSteps(theme, this);
@@ -53,7 +54,7 @@ RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     auto* row = new QHBoxLayout;
     row->setSpacing(theme.px(18));
     m_canvas = new RedEyeCanvas(page, theme, this);
-    bind(u"Picture1"_s, m_canvas, [this] { return m_page.caption; });
+    bind(u"Picture1"_s, m_canvas, [this] { return m_shows.caption; });
     row->addWidget(makeSide());
     auto* work = new QVBoxLayout;
     work->setSpacing(theme.px(10));
@@ -64,35 +65,35 @@ RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     frame().content()->addLayout(row, 1);
 
     auto* help = button(
-        u"CommandHelp"_s, page.CommandHelp, Role::Quiet, [&page] { page.CommandHelp_Click(); }, u"info"_s);
+        u"CommandHelp"_s, m_shows.CommandHelp, Role::Quiet, [&page] { page.CommandHelp_Click(); }, u"info"_s);
     frame().addHeaderAction(help);
     frame().addSecondaryAction(button(
-        u"Image9"_s, page.Image9, Role::Secondary, [&page] { page.Image9_Click(); }, u"close"_s));
+        u"Image9"_s, m_shows.Image9, Role::Secondary, [&page] { page.Image9_Click(); }, u"close"_s));
     frame().addSecondaryAction(button(
-        u"Image7"_s, page.Image7, Role::Secondary, [&page] { page.Image7_Click(); }, u"redeye-back"_s));
+        u"Image7"_s, m_shows.Image7, Role::Secondary, [&page] { page.Image7_Click(); }, u"redeye-back"_s));
     frame().addSecondaryAction(button(
-        u"Image5"_s, page.Image5, Role::Secondary, [&page] { page.Image5_Click(); }, u"eraser"_s));
+        u"Image5"_s, m_shows.Image5, Role::Secondary, [&page] { page.Image5_Click(); }, u"eraser"_s));
     m_accept = button(
-        u"Image8"_s, page.Image8, Role::Main, [&page] { page.Image8_Click(); }, u"tick-white"_s);
+        u"Image8"_s, m_shows.Image8, Role::Main, [&page] { page.Image8_Click(); }, u"tick-white"_s);
     frame().addMainAction(m_accept);
 
     m_darkenBeside = button(
-        u"Frame6"_s, page.Frame6, Role::Plain, [&page] { page.Frame6_Click(); }, u"redeye-darken"_s);
+        u"Frame6"_s, m_shows.Frame6, Role::Plain, [&page] { page.Frame6_Click(); }, u"redeye-darken"_s);
     m_more = button(
-        u"CommandMenu"_s, page.CommandMenu, Role::Plain, [&page] { page.kofez_Open(); }, u"redeye-more"_s);
+        u"CommandMenu"_s, m_shows.CommandMenu, Role::Plain, [&page] { page.kofez_Open(); }, u"redeye-more"_s);
     m_closer = new QPushButton(this);
     connect(m_closer, &QPushButton::clicked, this, [&page] { page.CommandCloser_Click(); });
-    bindSign(u"CommandCloser"_s, m_closer, u"redeye-closer"_s, page.CommandCloser);
+    bindSign(u"CommandCloser"_s, m_closer, u"redeye-closer"_s, m_shows.CommandCloser);
     m_further = new QPushButton(this);
     connect(m_further, &QPushButton::clicked, this, [&page] { page.CommandFurther_Click(); });
-    bindSign(u"CommandFurther"_s, m_further, u"redeye-further"_s, page.CommandFurther);
+    bindSign(u"CommandFurther"_s, m_further, u"redeye-further"_s, m_shows.CommandFurther);
     for (QPushButton* over : {m_darkenBeside, m_closer, m_further, m_more})
         over->setParent(m_canvas);
     m_busy = new QFrame(m_canvas);
     setRole(m_busy, "notice");
     auto* wait = new QVBoxLayout(m_busy);
     wait->setContentsMargins(theme.px(26), theme.px(18), theme.px(26), theme.px(18));
-    auto* waiting = label(u"Label4Busy"_s, page.Label4Busy, "large");
+    auto* waiting = label(u"Label4Busy"_s, m_shows.Label4Busy, "large");
     waiting->setWordWrap(false);
     wait->addWidget(waiting);
     connect(m_canvas, &RedEyeCanvas::resized, this, &RedIView::placeOverPicture);
@@ -108,9 +109,9 @@ QWidget* RedIView::firstFocus() const {
 }
 
 void RedIView::escape() {
-    if (m_page.kofez.visible)
+    if (m_shows.kofez.visible)
         m_page.kofez_Close();
-    else if (m_page.FrameHelp.visible)
+    else if (m_shows.FrameHelp.visible)
         m_page.CommandHelpClose_Click();
 }
 
@@ -122,7 +123,7 @@ QWidget* RedIView::makeSide() {
     column->setSpacing(theme().px(10));
 
     m_overview = new RedEyeOverview(m_page, theme(), *m_canvas, side);
-    bind(u"Picture3"_s, m_overview, [this] { return m_page.caption; });
+    bind(u"Picture3"_s, m_overview, [this] { return m_shows.caption; });
     column->addWidget(m_overview, 0, Qt::AlignHCenter);
 
     auto* card = new QFrame(side);
@@ -130,15 +131,15 @@ QWidget* RedIView::makeSide() {
     auto* wordsColumn = new QVBoxLayout(card);
     wordsColumn->setContentsMargins(theme().px(14), theme().px(8), theme().px(14), theme().px(8));
     wordsColumn->setSpacing(theme().px(4));
-    m_guide = words(u"Label40"_s, m_page.Label40);
+    m_guide = words(u"Label40"_s, m_shows.Label40);
     wordsColumn->addWidget(m_guide);
-    wordsColumn->addWidget(words(u"Label41"_s, m_page.Label41));
-    wordsColumn->addWidget(words(u"Label44"_s, m_page.Label44));
+    wordsColumn->addWidget(words(u"Label41"_s, m_shows.Label41));
+    wordsColumn->addWidget(words(u"Label44"_s, m_shows.Label44));
     m_notice = new QFrame(card);
     setRole(m_notice, "notice");
     auto* noticeColumn = new QVBoxLayout(m_notice);
     noticeColumn->setContentsMargins(theme().px(12), theme().px(6), theme().px(12), theme().px(6));
-    noticeColumn->addWidget(words(u"Label45"_s, m_page.Label45));
+    noticeColumn->addWidget(words(u"Label45"_s, m_shows.Label45));
     wordsColumn->addWidget(m_notice);
     wordsColumn->addStretch(1);
     column->addWidget(card, 1);
@@ -176,17 +177,17 @@ QLayout* RedIView::makePad() {
     const auto arrowUp = [&page] { page.Arrow_MouseUp(); };
     const auto sized = [&page] { page.Size_MouseUp(); };
     auto* up = hold(
-        u"Image12"_s, page.Image12, "sky", u"arrow-up"_s, [&page] { page.Image12_MouseDown(); }, arrowUp);
+        u"Image12"_s, m_shows.Image12, "sky", u"arrow-up"_s, [&page] { page.Image12_MouseDown(); }, arrowUp);
     auto* down = hold(
-        u"Image13"_s, page.Image13, "sky", u"arrow-down"_s, [&page] { page.Image13_MouseDown(); }, arrowUp);
+        u"Image13"_s, m_shows.Image13, "sky", u"arrow-down"_s, [&page] { page.Image13_MouseDown(); }, arrowUp);
     auto* left = hold(
-        u"Image14"_s, page.Image14, "sky", u"arrow-left"_s, [&page] { page.Image14_MouseDown(); }, arrowUp);
+        u"Image14"_s, m_shows.Image14, "sky", u"arrow-left"_s, [&page] { page.Image14_MouseDown(); }, arrowUp);
     auto* right = hold(
-        u"Image15"_s, page.Image15, "sky", u"arrow-right"_s, [&page] { page.Image15_MouseDown(); }, arrowUp);
+        u"Image15"_s, m_shows.Image15, "sky", u"arrow-right"_s, [&page] { page.Image15_MouseDown(); }, arrowUp);
     auto* smaller = hold(
-        u"Image10"_s, page.Image10, "violet", u"redeye-smaller"_s, [&page] { page.Image10_MouseDown(); }, sized);
+        u"Image10"_s, m_shows.Image10, "violet", u"redeye-smaller"_s, [&page] { page.Image10_MouseDown(); }, sized);
     auto* larger = hold(
-        u"Image11"_s, page.Image11, "violet", u"redeye-larger"_s, [&page] { page.Image11_MouseDown(); }, sized);
+        u"Image11"_s, m_shows.Image11, "violet", u"redeye-larger"_s, [&page] { page.Image11_MouseDown(); }, sized);
     auto* pad = new QWidget(this);
     pad->setLayoutDirection(Qt::LeftToRight);
     auto* grid = new QGridLayout(pad);
@@ -211,13 +212,13 @@ QLayout* RedIView::makeTools() {
     row->setSpacing(theme().px(10));
     row->addStretch(1);
     m_darken = button(
-        u"Image6"_s, page.Image6, Role::Secondary, [&page] { page.Image6_Click(); }, u"redeye-darken"_s);
+        u"Image6"_s, m_shows.Image6, Role::Secondary, [&page] { page.Image6_Click(); }, u"redeye-darken"_s);
     m_darken->installEventFilter(this);
     row->addWidget(m_darken);
     row->addWidget(button(
-        u"Image16"_s, page.Image16, Role::Secondary, [&page] { page.Image16_Click(); }, u"redeye-deeper"_s));
+        u"Image16"_s, m_shows.Image16, Role::Secondary, [&page] { page.Image16_Click(); }, u"redeye-deeper"_s));
     m_correct = button(
-        u"Image2"_s, page.Image2, Role::Main, [&page] { page.Image2_Click(); }, u"redeye-correct"_s);
+        u"Image2"_s, m_shows.Image2, Role::Main, [&page] { page.Image2_Click(); }, u"redeye-correct"_s);
     row->addWidget(m_correct);
     return row;
 }
@@ -236,15 +237,15 @@ QWidget* RedIView::makeOperator() {
     readings->addWidget(m_readout, 1);
     m_check = makeLabel(m_operator, "small");
     m_check->setAutoFillBackground(true);
-    bind(u"Label6"_s, m_check, [&page] { return page.Label6.text; });
+    bind(u"Label6"_s, m_check, [this] { return m_shows.Label6.text; });
     readings->addWidget(m_check);
     m_level = new QSlider(Qt::Horizontal, m_operator);
-    m_level->setRange(0, RedI::HScroll1Max);
+    m_level->setRange(0, RedIControls::HScroll1Max);
     connect(m_level, &QSlider::valueChanged, this, [&page](int value) { page.HScroll1_Change(value); });
-    bind(u"HScroll1"_s, m_level, [&page] { return QString::number(page.HScroll1); });
+    bind(u"HScroll1"_s, m_level, [this] { return QString::number(m_shows.HScroll1); });
     row->addWidget(m_level, 1);
-    row->addWidget(button(u"Command13"_s, page.Command13, Role::Quiet, [&page] { page.Command13_Click(); }));
-    row->addWidget(button(u"Command6"_s, page.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
+    row->addWidget(button(u"Command13"_s, m_shows.Command13, Role::Quiet, [&page] { page.Command13_Click(); }));
+    row->addWidget(button(u"Command6"_s, m_shows.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
     return m_operator;
 }
 
@@ -252,7 +253,7 @@ void RedIView::makeMenu() {
     RedI& page = m_page;
     m_menu = new Overlay(theme(), this);
     m_menu->setCardWidth(660);
-    m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, page.CommandMenu, "title"));
+    m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, m_shows.CommandMenu, "title"));
     auto* grid = new QGridLayout;
     grid->setSpacing(theme().px(10));
     const struct {
@@ -261,15 +262,15 @@ void RedIView::makeMenu() {
         void (RedI::*press)();
         const char* icon;
         Role role = Role::Plain;
-    } items[] = {{"Bsisi", page.Bsisi, &RedI::Bsisi_Click, "redeye-correct"},
-                 {"amok2", page.amok2, &RedI::amok2_Click, "redeye-correct"},
-                 {"amok3", page.amok3, &RedI::amok3_Click, "redeye-correct"},
-                 {"amok4", page.amok4, &RedI::amok4_Click, "redeye-correct"},
-                 {"amok5", page.amok5, &RedI::amok5_Click, "redeye-correct"},
-                 {"amok", page.amok, &RedI::amok_Click, "redeye-deeper"},
-                 {"Memokad", page.Memokad, &RedI::Memokad_Click, "redeye-correct"},
-                 {"Command3", page.Command3, &RedI::Command3_Click, "redeye-smaller"},
-                 {"Rstor", page.Rstor, &RedI::Rstor_Click, "eraser", Role::Danger}};
+    } items[] = {{"Bsisi", m_shows.Bsisi, &RedI::Bsisi_Click, "redeye-correct"},
+                 {"amok2", m_shows.amok2, &RedI::amok2_Click, "redeye-correct"},
+                 {"amok3", m_shows.amok3, &RedI::amok3_Click, "redeye-correct"},
+                 {"amok4", m_shows.amok4, &RedI::amok4_Click, "redeye-correct"},
+                 {"amok5", m_shows.amok5, &RedI::amok5_Click, "redeye-correct"},
+                 {"amok", m_shows.amok, &RedI::amok_Click, "redeye-deeper"},
+                 {"Memokad", m_shows.Memokad, &RedI::Memokad_Click, "redeye-correct"},
+                 {"Command3", m_shows.Command3, &RedI::Command3_Click, "redeye-smaller"},
+                 {"Rstor", m_shows.Rstor, &RedI::Rstor_Click, "eraser", Role::Danger}};
     int place = 0;
     for (const auto& item : items) {
         const auto press = [&page, handler = item.press] { (page.*handler)(); };
@@ -278,7 +279,8 @@ void RedIView::makeMenu() {
             place / 2, place % 2);
         ++place;
     }
-    auto* back = button(u"CommandMenuClose"_s, page.CommandMenuClose, Role::Secondary, [&page] { page.kofez_Close(); });
+    auto* back =
+        button(u"CommandMenuClose"_s, m_shows.CommandMenuClose, Role::Secondary, [&page] { page.kofez_Close(); });
     grid->addWidget(back, place / 2, place % 2);
     m_menu->column()->addLayout(grid);
     m_menu->setFirstFocus(back);
@@ -289,12 +291,12 @@ void RedIView::makeHelp() {
     RedI& page = m_page;
     m_help = new Overlay(theme(), this);
     m_help->setCardWidth(640);
-    m_help->column()->addWidget(label(u"FrameHelp"_s, page.FrameHelp, "title"));
-    m_help->column()->addWidget(label(u"Label38"_s, page.Label38));
+    m_help->column()->addWidget(label(u"FrameHelp"_s, m_shows.FrameHelp, "title"));
+    m_help->column()->addWidget(label(u"Label38"_s, m_shows.Label38));
     m_helpText = makeLabel(m_help, "muted");
     m_help->column()->addWidget(m_helpText);
     auto* close =
-        button(u"CommandHelpClose"_s, page.CommandHelpClose, Role::Main, [&page] { page.CommandHelpClose_Click(); });
+        button(u"CommandHelpClose"_s, m_shows.CommandHelpClose, Role::Main, [&page] { page.CommandHelpClose_Click(); });
     m_help->column()->addWidget(close, 0, Qt::AlignTrailing);
     m_help->setFirstFocus(close);
     connect(m_help, &Overlay::escaped, this, [&page] { page.CommandHelpClose_Click(); });
@@ -302,20 +304,22 @@ void RedIView::makeHelp() {
 
 void RedIView::bindTheRest() {
     RedI& page = m_page;
-    bindHidden(u"kofez"_s, page.kofez);
-    bindHidden(u"RedTargetRectangle"_s, page.RedTargetRectangle);
-    bindHidden(u"Image1"_s, page.Image1);
+    bindHidden(u"kofez"_s, m_shows.kofez);
+    bindHidden(u"RedTargetRectangle"_s, m_shows.RedTargetRectangle);
+    bindHidden(u"Image1"_s, m_shows.Image1);
     const std::pair<const char*, const Caption*> operators[] = {
-        {"Label1", &page.Label1},   {"Label2", &page.Label2},   {"Label3", &page.Label3},   {"Label12", &page.Label12},
-        {"Label13", &page.Label13}, {"Label16", &page.Label16}, {"Label17", &page.Label17}, {"Label24", &page.Label24},
-        {"Label25", &page.Label25}, {"Label27", &page.Label27}, {"Label28", &page.Label28}, {"Label30", &page.Label30},
-        {"Label31", &page.Label31}, {"Label37", &page.Label37}, {"Label42", &page.Label42}, {"Label43", &page.Label43},
-        {"Rlbl", &page.Rlbl},       {"Glbl", &page.Glbl},       {"Blbl", &page.Blbl}};
+        {"Label1", &m_shows.Label1},   {"Label2", &m_shows.Label2},   {"Label3", &m_shows.Label3},
+        {"Label12", &m_shows.Label12}, {"Label13", &m_shows.Label13}, {"Label16", &m_shows.Label16},
+        {"Label17", &m_shows.Label17}, {"Label24", &m_shows.Label24}, {"Label25", &m_shows.Label25},
+        {"Label27", &m_shows.Label27}, {"Label28", &m_shows.Label28}, {"Label30", &m_shows.Label30},
+        {"Label31", &m_shows.Label31}, {"Label37", &m_shows.Label37}, {"Label42", &m_shows.Label42},
+        {"Label43", &m_shows.Label43}, {"Rlbl", &m_shows.Rlbl},       {"Glbl", &m_shows.Glbl},
+        {"Blbl", &m_shows.Blbl}};
     for (const auto& [name, caption] : operators)
         bindHidden(QString::fromLatin1(name), *caption);
-    bindList(u"List1"_s, page.List1);
-    bindList(u"List2"_s, page.List2);
-    bindList(u"Combo1"_s, page.Combo1);
+    bindList(u"List1"_s, m_shows.List1);
+    bindList(u"List2"_s, m_shows.List2);
+    bindList(u"Combo1"_s, m_shows.Combo1);
 }
 
 bool RedIView::eventFilter(QObject* watched, QEvent* event) {
@@ -339,7 +343,7 @@ void RedIView::placeOverPicture() {
         x += glass->width() + theme().px(6);
     }
     m_darkenBeside->adjustSize();
-    const QPointF wanted = m_canvas->onWidget(m_page.Frame6Place);
+    const QPointF wanted = m_canvas->onWidget(m_shows.Frame6Place);
     const QRect room = m_canvas->rect().adjusted(edge, edge, -edge, -edge);
     m_darkenBeside->move(
         std::clamp(static_cast<int>(wanted.x()), room.left(),
@@ -351,13 +355,11 @@ void RedIView::placeOverPicture() {
 }
 
 void RedIView::render() {
-    m_steps->show({wording(u"הקש על העין"_s, u"Tap the red eye"_s), wording(u"התאם את העיגול"_s, u"Fit the circle"_s),
-                   wording(u"לחץ על תיקון"_s, u"Press Correct"_s), wording(u"אשר את התמונה"_s, u"Accept"_s)},
-                  m_page.stepNumber());
+    m_steps->show(m_shows.words.steps, m_page.stepNumber());
     m_overview->fit();
     m_canvas->update();
-    speak(m_canvas, wording(u"התמונה: %1"_s, u"The picture: %1"_s).arg(LeafName(m_page.caption)));
-    speak(m_overview, wording(u"התמונה כולה, הקש על העין האדומה"_s, u"The whole picture: tap the red eye"_s));
+    speak(m_canvas, m_shows.words.picture.arg(LeafName(m_shows.caption)));
+    speak(m_overview, m_shows.words.overview);
     for (const auto& [sign, caption] : m_signs) {
         sign->setEnabled(caption->enabled);
         sign->setToolTip(caption->hint.isEmpty() ? caption->text : caption->hint);
@@ -368,32 +370,26 @@ void RedIView::render() {
         label->setVisible(caption->visible);
     }
     // The longest of the instructions alone needs the small letters.
-    const char* type = m_page.Label41.visible ? "small" : "body";
+    const char* type = m_shows.Label41.visible ? "small" : "body";
     if (m_guide->property("type") != QLatin1String(type)) {
         m_guide->setProperty("type", type);
         m_guide->style()->polish(m_guide);
     }
-    m_busy->setVisible(m_page.Label4Busy.visible);
-    m_notice->setVisible(m_page.Label45.visible);
+    m_busy->setVisible(m_shows.Label4Busy.visible);
+    m_notice->setVisible(m_shows.Label45.visible);
     m_operator->setVisible(state().DegelEdit);
-    m_readout->setText(isolated(u"R %1 G %2 B %3 · %4 − %5 = %6 · %7 | %8"_s.arg(
-        m_page.Rlbl.text, m_page.Glbl.text, m_page.Blbl.text, m_page.Label3.text, m_page.Label12.text,
-        m_page.Label24.text, m_page.Label28.text,
-        QStringList{m_page.Label25.text, m_page.Label30.text, m_page.Label31.text, m_page.Label37.text,
-                    m_page.Label42.text, m_page.Label43.text}
-            .join(u" · "_s))));
+    m_readout->setText(isolated(m_page.readings()));
     QPalette check = palette();
-    if (m_page.Label6Order != RedI::Order::Unknown)
-        check.setColor(QPalette::Window,
-                       m_page.Label6Order == RedI::Order::InOrder ? Theme::Colour::GoodSoft : Theme::Colour::SunSoft);
+    if (m_shows.Label6Order != RedIControls::Order::Unknown)
+        check.setColor(QPalette::Window, m_shows.Label6Order == RedIControls::Order::InOrder ? Theme::Colour::GoodSoft
+                                                                                             : Theme::Colour::SunSoft);
     m_check->setPalette(check);
     const QSignalBlocker quiet(m_level);
-    m_level->setValue(m_page.HScroll1);
-    speak(m_level, m_page.Label37.text);
-    m_helpText->setText(
-        isolated(m_page.Label41.text + u'\n' + m_page.Label44.text.trimmed() + u'\n' + m_page.Label45.text.trimmed()));
-    m_menu->setOpen(m_page.kofez.visible);
-    m_help->setOpen(m_page.FrameHelp.visible);
+    m_level->setValue(m_shows.HScroll1);
+    speak(m_level, m_shows.Label37.text);
+    m_helpText->setText(isolated(m_page.helpText()));
+    m_menu->setOpen(m_shows.kofez.visible);
+    m_help->setOpen(m_shows.FrameHelp.visible);
     placeOverPicture();
 }
 

@@ -44,6 +44,7 @@ private:
     void bindTheRest();
 
     RedI& m_page;
+    const RedIControls& m_shows;
     RedEyeSteps* m_steps;
     RedEyeCanvas* m_canvas;
     RedEyeOverview* m_overview = nullptr;

@@ -1,6 +1,5 @@
 #include "views/mikledet/mikledetView.h"
 
-#include "order/EditRecord.h"
 #include "views/kit/CaptionField.h"
 #include "views/kit/HoldButton.h"
 #include "views/kit/Keyboard.h"
@@ -23,7 +22,8 @@ using namespace Qt::StringLiterals;
 
 mikledetView::mikledetView(mikledet& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page) {
+    , m_page(page)
+    , m_shows(page.controls()) {
     setRole(this, "panel");
     auto* column = frame().content();
     column->setContentsMargins(theme.px(14), theme.px(8), theme.px(14), theme.px(8));
@@ -36,11 +36,11 @@ mikledetView::mikledetView(mikledet& page, const SessionState& state, const Them
     column->addWidget(row);
     column->addWidget(makeKeys());
 
-    bindHidden(u"Title"_s, page.Title);
-    bindList(u"Combo1"_s, page.Combo1List);
-    bindHidden(u"Command10"_s, page.Command10);
-    bindHidden(u"Command13"_s, page.Command13);
-    bindHidden(u"Command14"_s, page.Command14);
+    bindHidden(u"Title"_s, m_shows.Title);
+    bindList(u"Combo1"_s, m_shows.Combo1List);
+    bindHidden(u"Command10"_s, m_shows.Command10);
+    bindHidden(u"Command13"_s, m_shows.Command13);
+    bindHidden(u"Command14"_s, m_shows.Command14);
     start();
 }
 
@@ -53,7 +53,7 @@ QPushButton* mikledetView::toKey(QPushButton* made) {
 
 QPushButton* mikledetView::key(int number) {
     mikledet& page = m_page;
-    auto* made = toKey(button(numbered("leter", number), page.leter[static_cast<std::size_t>(number)], Role::Plain,
+    auto* made = toKey(button(numbered("leter", number), m_shows.leter[static_cast<std::size_t>(number)], Role::Plain,
                               [&page, number] { page.leter_Click(number); }));
     made->setProperty("letterOfAnyLanguage", true);
     m_keys[static_cast<std::size_t>(number)] = made;
@@ -77,12 +77,12 @@ QLayout* mikledetView::makeTextRow() {
     row->setSpacing(theme().px(10));
     m_text = new CaptionField(
         {[&page](QChar character) { page.KeyPress(character); }, [&page] { page.Command6_Click(); }}, this);
-    bind(u"Text1"_s, m_text, [&page] { return page.Text1.text; });
+    bind(u"Text1"_s, m_text, [this] { return m_shows.Text1.text; });
     row->addWidget(m_text, 1);
-    row->addWidget(checkBox(u"Check4"_s, page.Check4, [&page](bool on) { page.Check4_Click(on); }));
+    row->addWidget(checkBox(u"Check4"_s, m_shows.Check4, [&page](bool on) { page.Check4_Click(on); }));
     row->addWidget(button(
-        u"Command8"_s, page.Command8, Role::Quiet, [&page] { page.Command8_Click(); }, u"trash"_s));
-    auto* done = button(u"CommandDone"_s, page.CommandDone, Role::Plain, [&page] { page.CommandDone_Click(); });
+        u"Command8"_s, m_shows.Command8, Role::Quiet, [&page] { page.Command8_Click(); }, u"trash"_s));
+    auto* done = button(u"CommandDone"_s, m_shows.CommandDone, Role::Plain, [&page] { page.CommandDone_Click(); });
     setRole(done, "done");
     setIcon(done, u"tick"_s, Qt::white);
     row->addWidget(done);
@@ -98,10 +98,10 @@ QWidget* mikledetView::makeAppearance() {
     const auto gap = [&] { row->addSpacing(theme().px(10)); };
 
     row->addWidget(holdButton(
-        u"Image1"_s, page.Image1, u"letter-larger"_s, [&page] { page.Image1_MouseDown(); },
+        u"Image1"_s, m_shows.Image1, u"letter-larger"_s, [&page] { page.Image1_MouseDown(); },
         [&page] { page.Image1_MouseUp(); }));
     row->addWidget(holdButton(
-        u"Image2"_s, page.Image2, u"letter-smaller"_s, [&page] { page.Image2_MouseDown(); },
+        u"Image2"_s, m_shows.Image2, u"letter-smaller"_s, [&page] { page.Image2_MouseDown(); },
         [&page] { page.Image2_MouseUp(); }));
     gap();
     // The arrows stand as they point, in both languages.
@@ -113,7 +113,7 @@ QWidget* mikledetView::makeAppearance() {
     static constexpr const char* icons[] = {"arrow-left", "arrow-right", "arrow-up", "arrow-down"};
     for (const int direction : {0, 2, 3, 1})
         arrowRow->addWidget(holdButton(
-            numbered("Image15", direction), page.Image15[static_cast<std::size_t>(direction)],
+            numbered("Image15", direction), m_shows.Image15[static_cast<std::size_t>(direction)],
             QString::fromLatin1(icons[direction]), [&page, direction] { page.Image15_MouseDown(direction); },
             [&page] { page.Image15_MouseUp(); }));
     row->addWidget(arrows);
@@ -123,10 +123,10 @@ QWidget* mikledetView::makeAppearance() {
         return made;
     };
     m_style = toRound(button(
-        u"Image3"_s, page.Image3, Role::Plain, [&page] { page.Image3_Click(); }, u"letter-regular"_s));
+        u"Image3"_s, m_shows.Image3, Role::Plain, [&page] { page.Image3_Click(); }, u"letter-regular"_s));
     row->addWidget(m_style);
     m_direction = toRound(button(
-        u"Image4"_s, page.Image4, Role::Plain, [&page] { page.Image4_Click(); }, u"text-across"_s));
+        u"Image4"_s, m_shows.Image4, Role::Plain, [&page] { page.Image4_Click(); }, u"text-across"_s));
     row->addWidget(m_direction);
     gap();
     auto* anchors = new QWidget(box);
@@ -140,7 +140,7 @@ QWidget* mikledetView::makeAppearance() {
         setRole(made, "round");
         made->setFocusPolicy(Qt::TabFocus);
         setIcon(made, QString::fromLatin1(anchorIcons[alignment]), Theme::Colour::Ink);
-        bindChoice(numbered("Image5", alignment), made, page.Image5[static_cast<std::size_t>(alignment)],
+        bindChoice(numbered("Image5", alignment), made, m_shows.Image5[static_cast<std::size_t>(alignment)],
                    [&page, alignment] { page.Image5_Click(alignment); });
         anchorRow->addWidget(made);
     }
@@ -148,7 +148,7 @@ QWidget* mikledetView::makeAppearance() {
     gap();
     m_palette = new PaletteBar(
         theme(), [&page](QPoint at) { page.Picture18_MouseDown(at); }, box);
-    bind(u"Picture18"_s, m_palette, page.Picture18);
+    bind(u"Picture18"_s, m_palette, m_shows.Picture18);
     row->addWidget(m_palette, 1);
     return box;
 }
@@ -179,10 +179,10 @@ QWidget* mikledetView::makeKeys() {
         grid->addWidget(key(places[static_cast<std::size_t>(at)]), at / columns, at % columns);
 
     auto* back = toKey(button(
-        u"Command3"_s, page.Command3, Role::Plain, [&page] { page.Command3_Click(); }, u"backspace"_s));
+        u"Command3"_s, m_shows.Command3, Role::Plain, [&page] { page.Command3_Click(); }, u"backspace"_s));
     grid->addWidget(back, 0, columns);
     auto* enter = toKey(button(
-        u"Command7"_s, page.Command7, Role::Quiet, [&page] { page.Command7_Click(); }, u"enter"_s));
+        u"Command7"_s, m_shows.Command7, Role::Quiet, [&page] { page.Command7_Click(); }, u"enter"_s));
     enter->setMaximumHeight(QWIDGETSIZE_MAX);
     enter->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     grid->addWidget(enter, 1, columns, 2, 1);
@@ -200,14 +200,14 @@ QWidget* mikledetView::makeKeys() {
         bindChoice(QString::fromLatin1(name), made, caption, std::move(clicked));
         return toKey(made);
     };
-    grid->addWidget(letters("Command4", page.Command4, [&page] { page.Command4_Click(); }), 3, 0);
-    grid->addWidget(letters("Command9", page.Command9, [&page] { page.Command9_Click(); }), 3, 1);
-    grid->addWidget(letters("Command2", page.Command2, [&page] { page.Command2_Click(); }), 3, 2);
-    m_more = toKey(button(u"Command5"_s, page.Command5, Role::Quiet, [&page] { page.Command5_Click(); }));
+    grid->addWidget(letters("Command4", m_shows.Command4, [&page] { page.Command4_Click(); }), 3, 0);
+    grid->addWidget(letters("Command9", m_shows.Command9, [&page] { page.Command9_Click(); }), 3, 1);
+    grid->addWidget(letters("Command2", m_shows.Command2, [&page] { page.Command2_Click(); }), 3, 2);
+    m_more = toKey(button(u"Command5"_s, m_shows.Command5, Role::Quiet, [&page] { page.Command5_Click(); }));
     grid->addWidget(m_more, 3, 3);
-    auto* space = toKey(button(u"Command1"_s, page.Command1, Role::Quiet, [&page] { page.Command1_Click(); }));
+    auto* space = toKey(button(u"Command1"_s, m_shows.Command1, Role::Quiet, [&page] { page.Command1_Click(); }));
     grid->addWidget(space, 3, 4, 1, 4);
-    auto* clear = toKey(button(u"Command6"_s, page.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
+    auto* clear = toKey(button(u"Command6"_s, m_shows.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
     grid->addWidget(clear, 3, 8, 1, 3);
 
     for (int i = 0; i < columns; ++i)
@@ -233,20 +233,20 @@ void mikledetView::keyPressEvent(QKeyEvent* event) {
 }
 
 void mikledetView::sayAll() {
-    speak(this, m_page.Title.text);
-    speak(m_text, wording(u"הטקסט שעל התמונה"_s, u"The text on the picture"_s));
+    speak(this, m_shows.Title.text);
+    speak(m_text, m_shows.words.text);
     const std::pair<const char*, const Caption*> images[] = {
-        {"Command3", &m_page.Command3}, {"Image1", &m_page.Image1}, {"Image2", &m_page.Image2},
-        {"Image3", &m_page.Image3},     {"Image4", &m_page.Image4}, {"Picture18", &m_page.Picture18}};
+        {"Command3", &m_shows.Command3}, {"Image1", &m_shows.Image1}, {"Image2", &m_shows.Image2},
+        {"Image3", &m_shows.Image3},     {"Image4", &m_shows.Image4}, {"Picture18", &m_shows.Picture18}};
     for (const auto& [name, caption] : images)
         speak(control(QString::fromLatin1(name))->widget, caption->hint);
     for (int i = 0; i < 4; ++i)
-        speak(control(numbered("Image15", i))->widget, m_page.Image15[static_cast<std::size_t>(i)].hint);
+        speak(control(numbered("Image15", i))->widget, m_shows.Image15[static_cast<std::size_t>(i)].hint);
     for (int i = 0; i < 3; ++i)
-        speak(control(numbered("Image5", i))->widget, m_page.Image5[static_cast<std::size_t>(i)].hint);
-    speak(control(u"Command4"_s)->widget, wording(u"אותיות בעברית"_s, u"Hebrew letters"_s));
-    speak(control(u"Command9"_s)->widget, wording(u"אותיות קטנות באנגלית"_s, u"Small letters"_s));
-    speak(control(u"Command2"_s)->widget, wording(u"אותיות גדולות באנגלית"_s, u"Capital letters"_s));
+        speak(control(numbered("Image5", i))->widget, m_shows.Image5[static_cast<std::size_t>(i)].hint);
+    speak(control(u"Command4"_s)->widget, m_shows.words.hebrewLetters);
+    speak(control(u"Command9"_s)->widget, m_shows.words.smallLetters);
+    speak(control(u"Command2"_s)->widget, m_shows.words.capitalLetters);
 }
 
 void mikledetView::showIcon(QPushButton* button, const QString& icon) {
@@ -257,15 +257,14 @@ void mikledetView::showIcon(QPushButton* button, const QString& icon) {
 }
 
 void mikledetView::render() {
-    const EditFields& edit = state().edit;
     sayAll();
-    m_text->showCaption(m_page.Text1.text);
+    m_text->showCaption(m_shows.Text1.text);
     m_text->setAlignment(Qt::AlignAbsolute | Qt::AlignVCenter | (state().english() ? Qt::AlignLeft : Qt::AlignRight));
-    m_row->setCurrentIndex(m_page.Frame1.visible ? 1 : 0);
-    m_palette->show(m_page.Picture18Image.image(), qRgb(edit.TextRed, edit.TextGreen, edit.TextBlue));
+    m_row->setCurrentIndex(m_shows.Frame1.visible ? 1 : 0);
+    m_palette->show(m_shows.Picture18Image.image(), m_page.colour());
     static constexpr const char* styles[] = {"letter-regular", "letter-bold", "letter-italic", "letter-bold-italic"};
-    showIcon(m_style, QString::fromLatin1(styles[edit.TextStyle & 3]));
-    showIcon(m_direction, edit.TextVertical == EditRecord::runsDown ? u"text-down"_s : u"text-across"_s);
+    showIcon(m_style, QString::fromLatin1(styles[m_page.style()]));
+    showIcon(m_direction, m_page.runsDown() ? u"text-down"_s : u"text-across"_s);
     // A key without a letter types a blank and shows the sign of one.
     for (QPushButton* made : m_keys) {
         const bool blank = made->text().isEmpty();
@@ -276,7 +275,7 @@ void mikledetView::render() {
                 made->setIcon({});
         }
         if (blank)
-            speak(made, wording(u"רווח"_s, u"Space"_s));
+            speak(made, m_shows.words.blankKey);
         else
             speak(made, made->text());
     }

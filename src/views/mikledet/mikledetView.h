@@ -37,6 +37,7 @@ private:
     void showIcon(QPushButton* button, const QString& icon);
 
     mikledet& m_page;
+    const mikledetControls& m_shows;
     CaptionField* m_text = nullptr;
     PaletteBar* m_palette = nullptr;
     QStackedLayout* m_row = nullptr; // the appearance or the symbols

@@ -54,8 +54,8 @@ EditorPaper::EditorPaper(tFrmNew& page, QWidget* parent)
 }
 
 void EditorPaper::render() {
-    m_scale = m_page.PicPicSize.width > 0 ? double(width()) / m_page.PicPicSize.width : 1;
-    const TextLabelBox& box = m_page.LabeltextBox;
+    m_scale = m_page.controls().PicPicSize.width > 0 ? double(width()) / m_page.controls().PicPicSize.width : 1;
+    const TextLabelBox& box = m_page.controls().LabeltextBox;
     // A finger needs some room, however small the caption is.
     QRectF area(box.left * m_scale, box.top * m_scale, box.width * m_scale, box.height * m_scale);
     const QPointF middle = area.center();
@@ -63,11 +63,11 @@ void EditorPaper::render() {
     area.moveCenter(middle);
     if (m_caption->geometry() != area.toRect())
         m_caption->setGeometry(area.toRect());
-    if (m_caption->isHidden() == m_page.Labeltext.visible)
-        m_caption->setVisible(m_page.Labeltext.visible);
+    if (m_caption->isHidden() == m_page.controls().Labeltext.visible)
+        m_caption->setVisible(m_page.controls().Labeltext.visible);
     // The same bitmap draws the same: a change elsewhere on the page leaves the paper alone.
-    if (m_shown.cacheKey() != m_page.PicPic.image().cacheKey() || m_page.crop.visible) {
-        m_shown = m_page.PicPic.image();
+    if (m_shown.cacheKey() != m_page.controls().PicPic.image().cacheKey() || m_page.controls().crop.visible) {
+        m_shown = m_page.controls().PicPic.image();
         update();
     }
 }
@@ -82,17 +82,17 @@ void EditorPaper::paintEvent(QPaintEvent*) {
     const bool asItIs = m_shown.size() == (QSizeF(size()) * ratio).toSize();
     painter.setRenderHint(QPainter::SmoothPixmapTransform, !asItIs);
     painter.drawImage(rect(), m_shown);
-    if (!m_page.crop.visible)
+    if (!m_page.controls().crop.visible)
         return;
     painter.setRenderHint(QPainter::Antialiasing);
     QPolygonF sides;
     for (const int at : {0, 1, 3, 2})
-        sides << QPointF(m_page.crop.marker(corners[at])) * m_scale;
+        sides << QPointF(m_page.controls().crop.marker(corners[at])) * m_scale;
     painter.setPen(QPen(Theme::Colour::Sun, 2));
     painter.drawPolygon(sides);
     painter.setBrush(Theme::Colour::Sun);
     for (const CropFrame::Corner corner : corners)
-        painter.drawEllipse(m_page.crop.handle(corner) * m_scale, 8, 8);
+        painter.drawEllipse(m_page.controls().crop.handle(corner) * m_scale, 8, 8);
 }
 
 void EditorPaper::drag(QEvent::Type type, QPointF at) {
@@ -123,7 +123,8 @@ void EditorPaper::mousePressEvent(QMouseEvent* event) {
     const QPointF at = onPaper(event->position());
     m_drag = Drag::Picture;
     for (const CropFrame::Corner corner : corners) {
-        if (m_page.crop.visible && QLineF(at, m_page.crop.handle(corner)).length() < handleRadius) {
+        if (m_page.controls().crop.visible &&
+            QLineF(at, m_page.controls().crop.handle(corner)).length() < handleRadius) {
             m_drag = Drag::CropHandle;
             m_page.CropHandle_MouseDown(corner, at);
             return;
@@ -188,7 +189,7 @@ EditorTable::EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent)
 
 void EditorTable::render(const QString& said) {
     const QSize room = size() - QSize(m_theme.px(20), m_theme.px(20));
-    const PictureSize paper = m_page.PicPicSize;
+    const PictureSize paper = m_page.controls().PicPicSize;
     const bool open = m_page.pictureOpen() && paper.width > 0 && paper.height > 0 && room.width() > 0;
     m_paper->setVisible(open);
     if (m_words != said) {

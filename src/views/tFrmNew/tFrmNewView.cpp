@@ -35,6 +35,7 @@ constexpr double columnWidth = 206; // of a group of tools
 tFrmNewView::tFrmNewView(tFrmNew& page, PageChain& chain, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
     , m_page(page)
+    , m_shows(page.controls())
     , m_chain(chain) {
     frame().steps().setStep(OrderStep::Pictures);
     frame().setTitleVisible(false);
@@ -46,8 +47,8 @@ tFrmNewView::tFrmNewView(tFrmNew& page, PageChain& chain, const SessionState& st
     m_nearTools = makePlaceAndLight();
     row->addWidget(m_nearTools);
     m_table = new EditorTable(page, theme, this);
-    bind(u"PicPic"_s, &m_table->paper(), [this] { return m_page.Title.text; });
-    bind(u"Labeltext"_s, m_table->paper().captionBox(), [this] { return m_page.Labeltext.text; });
+    bind(u"PicPic"_s, &m_table->paper(), [this] { return m_shows.Title.text; });
+    bind(u"Labeltext"_s, m_table->paper().captionBox(), [this] { return m_shows.Labeltext.text; });
     row->addWidget(m_table, 1);
     m_farTools = makeFramesAndMore();
     row->addWidget(m_farTools);
@@ -114,7 +115,7 @@ ToolButton* tFrmNewView::held(const QString& name, const Caption& caption, const
 
 ToolButton* tFrmNewView::zoomOrLight(int index, const QString& icon, QSizeF size) {
     auto* made = held(
-        u"Image2(%1)"_s.arg(index), m_page.Image2[static_cast<std::size_t>(index)], icon, size,
+        u"Image2(%1)"_s.arg(index), m_shows.Image2[static_cast<std::size_t>(index)], icon, size,
         [&page = m_page, index] { page.Image2_MouseDown(index); },
         [&page = m_page, index] { page.Image2_MouseUp(index); });
     made->installEventFilter(this);
@@ -122,7 +123,7 @@ ToolButton* tFrmNewView::zoomOrLight(int index, const QString& icon, QSizeF size
 }
 
 ToolButton* tFrmNewView::colour(int index, const QString& icon, QColor ink) {
-    auto* made = tool(u"Image2(%1)"_s.arg(index), m_page.Image2[static_cast<std::size_t>(index)], icon, narrow,
+    auto* made = tool(u"Image2(%1)"_s.arg(index), m_shows.Image2[static_cast<std::size_t>(index)], icon, narrow,
                       [&page = m_page, index] { page.Image2_Click(index); });
     made->setInk(ink);
     made->installEventFilter(this);
@@ -151,16 +152,19 @@ QWidget* tFrmNewView::makePlaceAndLight() {
                 name, caption, icon, narrow, [&page, down] { (page.*down)(); }, [&page, up] { (page.*up)(); }),
             row, at);
     };
-    move(u"Image125"_s, page.Image125, u"arrow-up"_s, &tFrmNew::Image125_MouseDown, &tFrmNew::Image125_MouseUp, 0, 1);
-    move(u"Image115"_s, page.Image115, u"arrow-left"_s, &tFrmNew::Image115_MouseDown, &tFrmNew::Image115_MouseUp, 1, 0);
+    move(u"Image125"_s, m_shows.Image125, u"arrow-up"_s, &tFrmNew::Image125_MouseDown, &tFrmNew::Image125_MouseUp, 0,
+         1);
+    move(u"Image115"_s, m_shows.Image115, u"arrow-left"_s, &tFrmNew::Image115_MouseDown, &tFrmNew::Image115_MouseUp, 1,
+         0);
     m_zoom = makeLabel(pad, "large");
     m_zoom->setAlignment(Qt::AlignCenter);
     m_zoom->setWordWrap(false);
-    bind(u"Label11"_s, m_zoom, [&page] { return page.Label11.text; });
+    bind(u"Label11"_s, m_zoom, [this] { return m_shows.Label11.text; });
     cross->addWidget(m_zoom, 1, 1);
-    move(u"Image135"_s, page.Image135, u"arrow-right"_s, &tFrmNew::Image135_MouseDown, &tFrmNew::Image135_MouseUp, 1,
+    move(u"Image135"_s, m_shows.Image135, u"arrow-right"_s, &tFrmNew::Image135_MouseDown, &tFrmNew::Image135_MouseUp, 1,
          2);
-    move(u"Image145"_s, page.Image145, u"arrow-down"_s, &tFrmNew::Image145_MouseDown, &tFrmNew::Image145_MouseUp, 2, 1);
+    move(u"Image145"_s, m_shows.Image145, u"arrow-down"_s, &tFrmNew::Image145_MouseDown, &tFrmNew::Image145_MouseUp, 2,
+         1);
     for (int i = 0; i < 3; ++i)
         cross->setColumnStretch(i, 1);
     place->layout()->addWidget(pad);
@@ -168,7 +172,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
     QFrame* turns = group(*column, m_turnTitle);
     auto* turnRow = new QHBoxLayout;
     turnRow->setSpacing(theme().px(5));
-    m_turn = tool(u"Image15"_s, page.Image15, u"quarter-right"_s, wide, [&page] {
+    m_turn = tool(u"Image15"_s, m_shows.Image15, u"quarter-right"_s, wide, [&page] {
         page.Image15_Click();
         page.Image15_MouseMove();
     });
@@ -178,7 +182,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
     m_fineTurn = new ToolButton(theme(), u"turn-fine"_s, wide, turns);
     m_fineTurn->setObjectName(u"Frame4Opener"_s);
     connect(m_fineTurn, &QPushButton::clicked, this,
-            [&page] { page.Frame4.visible ? page.Image2_MouseMove() : page.Image15_MouseMove(); });
+            [this] { m_shows.Frame4.visible ? page.Image2_MouseMove() : page.Image15_MouseMove(); });
     turnRow->addWidget(m_fineTurn);
     static_cast<QVBoxLayout*>(turns->layout())->addLayout(turnRow);
 
@@ -207,22 +211,22 @@ QWidget* tFrmNewView::makeFramesAndMore() {
     auto* moreRow = new QHBoxLayout(more);
     moreRow->setContentsMargins(theme().px(8), theme().px(8), theme().px(8), theme().px(8));
     moreRow->setSpacing(theme().px(5));
-    m_tones = tool(u"Image13"_s, page.Image13, u"tones"_s, narrow, [&page] { page.Image13_MouseMove(); });
+    m_tones = tool(u"Image13"_s, m_shows.Image13, u"tones"_s, narrow, [&page] { page.Image13_MouseMove(); });
     m_tones->installEventFilter(this);
     moreRow->addWidget(m_tones);
-    moreRow->addWidget(tool(u"Command8"_s, page.Command8, u"text"_s, narrow, [&page] { page.Command8_Click(); }));
+    moreRow->addWidget(tool(u"Command8"_s, m_shows.Command8, u"text"_s, narrow, [&page] { page.Command8_Click(); }));
     moreRow->addWidget(colour(7, u"eye"_s, QColor(0xB2, 0x32, 0x2A)));
     column->addWidget(more);
 
     QFrame* frames = group(*column, m_framesTitle);
     auto* inside = static_cast<QVBoxLayout*>(frames->layout());
     auto* category =
-        comboBox(u"Combo4"_s, page.Combo4List, page.Combo4, [&page](int index) { page.Combo4_Click(index); });
+        comboBox(u"Combo4"_s, m_shows.Combo4List, m_shows.Combo4, [&page](int index) { page.Combo4_Click(index); });
     category->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     inside->addWidget(category);
     m_frames = new FrameThumbs(
         theme(), [&page](int row) { return page.framePicture(row); }, frames);
-    bindList(u"Combo2"_s, page.Combo2List, m_frames);
+    bindList(u"Combo2"_s, m_shows.Combo2List, m_frames);
     connect(m_frames, &FrameThumbs::picked, this, [&page](int row) { page.Combo2_Click(row); });
     inside->addWidget(m_frames, 1);
     auto* steps = new QHBoxLayout;
@@ -234,7 +238,7 @@ QWidget* tFrmNewView::makeFramesAndMore() {
         m_hintLines.emplace_back(nullptr, &caption);
         return made;
     };
-    steps->addWidget(step(u"Image21"_s, page.Image21, [&page] { page.Image21_Click(); }));
+    steps->addWidget(step(u"Image21"_s, m_shows.Image21, [&page] { page.Image21_Click(); }));
     // "3 / 8" reads from left to right.
     auto* position = new QWidget(frames);
     position->setLayoutDirection(Qt::LeftToRight);
@@ -244,22 +248,22 @@ QWidget* tFrmNewView::makeFramesAndMore() {
     numbers->addStretch(1);
     m_position = makeLabel(position, "strong");
     m_position->setWordWrap(false);
-    bind(u"Label6"_s, m_position, [&page] { return page.Label6.text; });
+    bind(u"Label6"_s, m_position, [this] { return m_shows.Label6.text; });
     numbers->addWidget(m_position);
-    auto* count = label(u"Label5"_s, page.Label5, "strong");
+    auto* count = label(u"Label5"_s, m_shows.Label5, "strong");
     count->setWordWrap(false);
     numbers->addWidget(count);
     numbers->addStretch(1);
     steps->addWidget(position, 1);
-    steps->addWidget(step(u"Image20"_s, page.Image20, [&page] { page.Image20_Click(); }));
+    steps->addWidget(step(u"Image20"_s, m_shows.Image20, [&page] { page.Image20_Click(); }));
     inside->addLayout(steps);
     auto* use = new QHBoxLayout;
     use->setSpacing(theme().px(5));
-    use->addWidget(tool(u"Image22"_s, page.Image22, u"frame"_s, wide, [&page] { page.Image22_Click(); }));
-    use->addWidget(tool(u"Image28"_s, page.Image28, u"frame-off"_s, wide, [&page] { page.Image28_Click(); }));
+    use->addWidget(tool(u"Image22"_s, m_shows.Image22, u"frame"_s, wide, [&page] { page.Image22_Click(); }));
+    use->addWidget(tool(u"Image28"_s, m_shows.Image28, u"frame-off"_s, wide, [&page] { page.Image28_Click(); }));
     inside->addLayout(use);
     inside->addWidget(
-        checkBox(u"Misgerett"_s, page.Misgerett, [&page](bool checked) { page.Misgerett_Click(checked); }));
+        checkBox(u"Misgerett"_s, m_shows.Misgerett, [&page](bool checked) { page.Misgerett_Click(checked); }));
     column->setStretch(1, 1);
     return box;
 }
@@ -287,24 +291,24 @@ QWidget* tFrmNewView::makeStrip() {
 void tFrmNewView::makeBars() {
     tFrmNew& page = m_page;
     m_undo = button(
-        u"Image2(5)"_s, page.Image2[5], Role::Secondary, [&page] { page.Image2_Click(5); }, u"undo"_s);
+        u"Image2(5)"_s, m_shows.Image2[5], Role::Secondary, [&page] { page.Image2_Click(5); }, u"undo"_s);
     m_undo->installEventFilter(this);
     m_undo->setMouseTracking(true);
     frame().addSecondaryAction(m_undo);
-    m_hintLines.emplace_back(nullptr, &page.Image2[5]);
+    m_hintLines.emplace_back(nullptr, &m_shows.Image2[5]);
     frame().addHeaderAction(button(
-        u"Image29"_s, page.Image29, Role::Quiet, [&page] { page.Image29_Click(); }, u"info"_s));
+        u"Image29"_s, m_shows.Image29, Role::Quiet, [&page] { page.Image29_Click(); }, u"info"_s));
     m_name = makeLabel(this, "muted");
     m_name->setWordWrap(false);
-    bind(u"Title"_s, m_name, [&page] { return page.Title.text; });
+    bind(u"Title"_s, m_name, [this] { return m_shows.Title.text; });
     frame().addStatus(m_name);
-    m_done = button(u"CommandDone"_s, page.CommandDone, Role::Main, [&page] { page.CommandDone_Click(); });
+    m_done = button(u"CommandDone"_s, m_shows.CommandDone, Role::Main, [&page] { page.CommandDone_Click(); });
     frame().addMainAction(m_done);
 }
 
 void tFrmNewView::bindTheRest() {
-    bindHidden(u"Image19"_s, m_page.Image19);
-    bindHidden(u"Picture3"_s, m_page.Picture3);
+    bindHidden(u"Image19"_s, m_shows.Image19);
+    bindHidden(u"Picture3"_s, m_shows.Picture3);
 }
 
 // --- what the page says ---
@@ -322,25 +326,23 @@ void tFrmNewView::listenToPictures() {
 }
 
 void tFrmNewView::renderTitles() {
-    m_placeTitle->setText(wording(u"גודל ומקום"_s, u"Size and place"_s));
-    m_turnTitle->setText(wording(u"סיבוב"_s, u"Turn"_s));
-    m_lightTitle->setText(wording(u"אור וצבע"_s, u"Light and colour"_s));
-    m_framesTitle->setText(wording(u"מסגרות"_s, u"Frames"_s));
-    m_fineTurn->setText(wording(u"סיבוב עדין"_s, u"Fine turn"_s));
+    m_placeTitle->setText(m_shows.words.place);
+    m_turnTitle->setText(m_shows.words.turn);
+    m_lightTitle->setText(m_shows.words.light);
+    m_framesTitle->setText(m_shows.words.frames);
+    m_fineTurn->setText(m_shows.words.fineTurn);
     m_fineTurn->setAccessibleName(m_fineTurn->text());
-    m_zoom->setText(isolated(m_page.Label11.text + u'%'));
-    speak(findChild<QWidget*>(u"Combo4"_s), wording(u"קטגוריית המסגרות"_s, u"Category of frames"_s));
-    speak(m_frames, wording(u"המסגרות של הקטגוריה"_s, u"Frames of the category"_s));
+    m_zoom->setText(isolated(m_shows.Label11.text + u'%'));
+    speak(findChild<QWidget*>(u"Combo4"_s), m_shows.words.categories);
+    speak(m_frames, m_shows.words.framesOfCategory);
     for (const char* name : {"Image20", "Image21"}) {
         auto* step = findChild<QPushButton*>(QString::fromLatin1(name));
         step->setText({});
         const bool next = name == std::string_view("Image20");
         setDirectedIcon(step, next ? Way::Forwards : Way::Back);
-        speak(step, next ? m_page.Image20.text : m_page.Image21.text);
+        speak(step, next ? m_shows.Image20.text : m_shows.Image21.text);
     }
-    // The code counts from 180; people count from 0.
-    const int angle = (m_page.Label10.text.toInt() - 180 + 720) % 360;
-    m_angle->setText(isolated(u"%1°"_s.arg(angle > 180 ? angle - 360 : angle)));
+    m_angle->setText(isolated(u"%1°"_s.arg(m_page.turnDegrees())));
 }
 
 void tFrmNewView::renderStrip() {
@@ -356,17 +358,15 @@ void tFrmNewView::renderStrip() {
         }
         m_cells[i]->show(look);
         name = name.section(u'\\', -1);
-        speak(m_cells[i], !look.filled ? wording(u"תא ריק"_s, u"Empty place"_s)
-                          : look.open  ? wording(u"%1, פתוחה לעריכה"_s, u"%1, open for editing"_s).arg(name)
-                                       : wording(u"%1, לחץ לעריכה"_s, u"%1, press to edit"_s).arg(name));
+        speak(m_cells[i], !look.filled ? m_shows.words.emptyCell
+                          : look.open  ? m_shows.words.openCell.arg(name)
+                                       : m_shows.words.otherCell.arg(name));
     }
 }
 
 void tFrmNewView::renderFrames() {
-    const EditFields& edit = state().edit;
-    const bool here = m_page.pictureOpen() && edit.FrameFolder.trimmed() == m_page.Combo4.text;
-    m_position->setText(m_page.Label6.text.isEmpty() ? u"–  / "_s : m_page.Label6.text);
-    m_frames->setWorn(here ? m_page.Combo2List.find(edit.FrameName.trimmed()) : -1);
+    m_position->setText(m_shows.Label6.text.isEmpty() ? u"–  / "_s : m_shows.Label6.text);
+    m_frames->setWorn(m_page.frameOnPicture());
 }
 
 void tFrmNewView::render() {
@@ -376,13 +376,13 @@ void tFrmNewView::render() {
     renderFrames();
     renderHints();
     const bool uncovered = m_covered == 0;
-    m_nearTools->setVisible(uncovered && m_page.Picture3.visible);
-    m_farTools->setVisible(uncovered && m_page.Picture3.visible);
+    m_nearTools->setVisible(uncovered && m_shows.Picture3.visible);
+    m_farTools->setVisible(uncovered && m_shows.Picture3.visible);
     m_strip->setVisible(uncovered);
-    m_undo->setVisible(m_page.Picture3.visible);
-    m_name->setText(fromLeft(m_name->fontMetrics().elidedText(m_page.Title.text, Qt::ElideMiddle, theme().px(260))));
+    m_undo->setVisible(m_shows.Picture3.visible);
+    m_name->setText(fromLeft(m_name->fontMetrics().elidedText(m_shows.Title.text, Qt::ElideMiddle, theme().px(260))));
     m_operator->setVisible(state().DegelEdit);
-    m_table->render(m_page.Image19.visible ? m_page.Image19.text : QString());
+    m_table->render(m_shows.Image19.visible ? m_shows.Image19.text : QString());
     placePanels();
 }
 
@@ -400,12 +400,12 @@ void tFrmNewView::setCoveredHeight(int pixels) {
 }
 
 QWidget* tFrmNewView::firstFocus() const {
-    return m_page.Picture3.visible ? static_cast<QWidget*>(m_zoomIn) : m_done;
+    return m_shows.Picture3.visible ? static_cast<QWidget*>(m_zoomIn) : m_done;
 }
 
 void tFrmNewView::escape() {
-    if (m_page.Frame3.visible || m_page.Frame4.visible) {
-        QPushButton* opener = m_page.Frame3.visible ? m_tones : m_fineTurn;
+    if (m_shows.Frame3.visible || m_shows.Frame4.visible) {
+        QPushButton* opener = m_shows.Frame3.visible ? m_tones : m_fineTurn;
         m_page.Image2_MouseMove();
         opener->setFocus(Qt::OtherFocusReason);
     } else {

@@ -69,6 +69,7 @@ private:
     void listenToPictures();
 
     tFrmNew& m_page;
+    const tFrmNewControls& m_shows;
     PageChain& m_chain;
     QPointer<kyoskNew> m_pictures;
     EditorTable* m_table = nullptr;

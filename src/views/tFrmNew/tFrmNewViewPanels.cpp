@@ -77,12 +77,12 @@ protected:
                              i % LineFramePalette::rows * LineFramePalette::cell, LineFramePalette::cell - 1,
                              LineFramePalette::cell - 1);
         }
-        const QColor colour = *lineFrameColour(m_page.palette.letter());
+        const QColor colour = *lineFrameColour(m_page.controls().palette.letter());
         painter.setPen(QPen(Theme::Colour::Primary, 2));
         painter.setBrush(colour);
-        painter.drawRect(m_page.palette.marker().adjusted(1, 1, -1, -1));
+        painter.drawRect(m_page.controls().palette.marker().adjusted(1, 1, -1, -1));
         painter.setPen(colour.lightness() < 128 ? Qt::white : Qt::black);
-        painter.drawText(m_page.palette.marker(), Qt::AlignCenter, m_page.palette.letter());
+        painter.drawText(m_page.controls().palette.marker(), Qt::AlignCenter, m_page.controls().palette.letter());
     }
 
 private:
@@ -104,12 +104,12 @@ void tFrmNewView::makeTonePanel() {
         row->addWidget(made);
     };
     tFrmNew& page = m_page;
-    tone(u"Image5"_s, page.Image5, {1, 1, 1}, false, [&page] { page.Image5_Click(); });
-    tone(u"Image4"_s, page.Image4, {1, 1, 1}, true, [&page] { page.Image4_Click(); });
-    tone(u"Image11"_s, page.Image11, {1.3, 1, 0.8}, true, [&page] { page.Image11_Click(); });
-    tone(u"Image12"_s, page.Image12, {1, 1, 1.3}, true, [&page] { page.Image12_Click(); });
-    tone(u"Image9"_s, page.Image9, {1, 1.3, 1}, true, [&page] { page.Image9_Click(); });
-    bind(u"Frame3"_s, m_tonePanel, page.Frame3);
+    tone(u"Image5"_s, m_shows.Image5, {1, 1, 1}, false, [&page] { page.Image5_Click(); });
+    tone(u"Image4"_s, m_shows.Image4, {1, 1, 1}, true, [&page] { page.Image4_Click(); });
+    tone(u"Image11"_s, m_shows.Image11, {1.3, 1, 0.8}, true, [&page] { page.Image11_Click(); });
+    tone(u"Image12"_s, m_shows.Image12, {1, 1, 1.3}, true, [&page] { page.Image12_Click(); });
+    tone(u"Image9"_s, m_shows.Image9, {1, 1.3, 1}, true, [&page] { page.Image9_Click(); });
+    bind(u"Frame3"_s, m_tonePanel, m_shows.Frame3);
 }
 
 void tFrmNewView::makeTurnPanel() {
@@ -121,27 +121,27 @@ void tFrmNewView::makeTurnPanel() {
     row->setContentsMargins(theme().px(8), theme().px(8), theme().px(8), theme().px(8));
     row->setSpacing(theme().px(5));
     tFrmNew& page = m_page;
-    row->addWidget(tool(u"Image18"_s, page.Image18, u"quarter-left"_s, inPanel, [&page] { page.Image18_Click(); }));
+    row->addWidget(tool(u"Image18"_s, m_shows.Image18, u"quarter-left"_s, inPanel, [&page] { page.Image18_Click(); }));
     row->addWidget(held(
-        u"Image17"_s, page.Image17, u"turn-left"_s, inPanel, [&page] { page.Image17_MouseDown(); },
+        u"Image17"_s, m_shows.Image17, u"turn-left"_s, inPanel, [&page] { page.Image17_MouseDown(); },
         [&page] { page.Image17_MouseUp(); }));
     m_angle = makeLabel(m_turnPanel, "large");
     m_angle->setAlignment(Qt::AlignCenter);
     m_angle->setWordWrap(false);
     m_angle->setMinimumWidth(theme().px(60));
-    bind(u"Label10"_s, m_angle, [&page] { return page.Label10.text; });
+    bind(u"Label10"_s, m_angle, [this] { return m_shows.Label10.text; });
     row->addWidget(m_angle);
     row->addWidget(held(
-        u"Image16"_s, page.Image16, u"turn-right"_s, inPanel, [&page] { page.Image16_MouseDown(); },
+        u"Image16"_s, m_shows.Image16, u"turn-right"_s, inPanel, [&page] { page.Image16_MouseDown(); },
         [&page] { page.Image16_MouseUp(); }));
-    row->addWidget(tool(u"Image27"_s, page.Image27, u"upright"_s, inPanel, [&page] { page.Image27_Click(); }));
-    bind(u"Frame4"_s, m_turnPanel, page.Frame4);
+    row->addWidget(tool(u"Image27"_s, m_shows.Image27, u"upright"_s, inPanel, [&page] { page.Image27_Click(); }));
+    bind(u"Frame4"_s, m_turnPanel, m_shows.Frame4);
 }
 
 // What doubles another control or shows the customer nothing is for the operator.
 void tFrmNewView::makeOperatorPanel() {
     tFrmNew& page = m_page;
-    bindHidden(u"Frame5"_s, page.Frame5);
+    bindHidden(u"Frame5"_s, m_shows.Frame5);
     m_operatorPanel = new QFrame(this);
     setRole(m_operatorPanel, "notice");
     m_operatorPanel->hide();
@@ -150,7 +150,7 @@ void tFrmNewView::makeOperatorPanel() {
     m_operator->setObjectName(u"Frame5Opener"_s);
     m_operator->setFocusPolicy(Qt::TabFocus);
     setIcon(m_operator, u"gear"_s, Theme::Colour::Ink);
-    speak(m_operator, u"Operator"_s);
+    speak(m_operator, m_shows.words.operatorPanel);
     connect(m_operator, &QPushButton::clicked, this, [this] {
         m_operatorPanel->setVisible(m_operatorPanel->isHidden());
         placePanels();
@@ -166,36 +166,36 @@ void tFrmNewView::makeOperatorPanel() {
         return row;
     };
     QHBoxLayout& sizes = *addRow();
-    addPlain(sizes, u"Command24"_s, page.Command24, &tFrmNew::Command24_Click);
-    addPlain(sizes, u"Command12"_s, page.Command12, &tFrmNew::Command12_Click);
-    addPlain(sizes, u"Command10"_s, page.Command10, &tFrmNew::Command10_Click);
-    addPlain(sizes, u"Command23"_s, page.Command23, &tFrmNew::Command23_Click);
-    addPlain(sizes, u"Command4"_s, page.Command4, &tFrmNew::Command4_Click);
-    addPlain(sizes, u"Command2"_s, page.Command2, &tFrmNew::Command2_Click);
-    addPlain(sizes, u"Command6"_s, page.Command6, &tFrmNew::Command6_Click);
+    addPlain(sizes, u"Command24"_s, m_shows.Command24, &tFrmNew::Command24_Click);
+    addPlain(sizes, u"Command12"_s, m_shows.Command12, &tFrmNew::Command12_Click);
+    addPlain(sizes, u"Command10"_s, m_shows.Command10, &tFrmNew::Command10_Click);
+    addPlain(sizes, u"Command23"_s, m_shows.Command23, &tFrmNew::Command23_Click);
+    addPlain(sizes, u"Command4"_s, m_shows.Command4, &tFrmNew::Command4_Click);
+    addPlain(sizes, u"Command2"_s, m_shows.Command2, &tFrmNew::Command2_Click);
+    addPlain(sizes, u"Command6"_s, m_shows.Command6, &tFrmNew::Command6_Click);
     QHBoxLayout& lines = *addRow();
     m_palette = new Palette(page, m_operatorPanel);
-    bind(u"pic4Msgrt"_s, m_palette, [&page] { return page.Label4.text; });
-    bindHidden(u"Label4"_s, page.Label4);
+    bind(u"pic4Msgrt"_s, m_palette, [this] { return m_shows.Label4.text; });
+    bindHidden(u"Label4"_s, m_shows.Label4);
     lines.addWidget(m_palette);
-    auto* styles = comboBox(u"Combo5"_s, page.Combo5List, page.Combo5, [](int) {});
-    speak(styles, u"Line style"_s);
+    auto* styles = comboBox(u"Combo5"_s, m_shows.Combo5List, m_shows.Combo5, [](int) {});
+    speak(styles, m_shows.words.lineStyles);
     lines.addWidget(styles);
-    addPlain(lines, u"Command18"_s, page.Command18, &tFrmNew::Command18_Click);
-    addPlain(lines, u"Command9"_s, page.Command9, &tFrmNew::Command9_Click);
+    addPlain(lines, u"Command18"_s, m_shows.Command18, &tFrmNew::Command18_Click);
+    addPlain(lines, u"Command9"_s, m_shows.Command9, &tFrmNew::Command9_Click);
     QHBoxLayout& crop = *addRow();
-    addPlain(crop, u"Command14"_s, page.Command14, &tFrmNew::Command14_Click);
-    addPlain(crop, u"Command13"_s, page.Command13, &tFrmNew::Command13_Click);
-    addPlain(crop, u"Command16"_s, page.Command16, &tFrmNew::Command16_Click);
-    addPlain(crop, u"Command15"_s, page.Command15, &tFrmNew::Command15_Click);
+    addPlain(crop, u"Command14"_s, m_shows.Command14, &tFrmNew::Command14_Click);
+    addPlain(crop, u"Command13"_s, m_shows.Command13, &tFrmNew::Command13_Click);
+    addPlain(crop, u"Command16"_s, m_shows.Command16, &tFrmNew::Command16_Click);
+    addPlain(crop, u"Command15"_s, m_shows.Command15, &tFrmNew::Command15_Click);
     auto* bar = new QSlider(Qt::Horizontal, m_operatorPanel);
-    bar->setRange(tFrmNew::VScrollZMin, tFrmNew::VScrollZMax);
+    bar->setRange(tFrmNewControls::VScrollZMin, tFrmNewControls::VScrollZMax);
     bar->setMinimumHeight(theme().target());
-    bar->setValue(page.VScrollZ);
+    bar->setValue(m_shows.VScrollZ);
     connect(bar, &QSlider::valueChanged, this, [&page](int value) { page.VScrollZ_Change(value); });
-    bind(u"VScrollZ"_s, bar, [&page] { return QString::number(page.VScrollZ); });
+    bind(u"VScrollZ"_s, bar, [this] { return QString::number(m_shows.VScrollZ); });
     crop.addWidget(bar, 1);
-    auto* record = label(u"Label13"_s, page.Label13, "small");
+    auto* record = label(u"Label13"_s, m_shows.Label13, "small");
     record->setLayoutDirection(Qt::LeftToRight);
     column->addWidget(record);
 }
@@ -235,20 +235,11 @@ void tFrmNewView::makeHints() {
 }
 
 void tFrmNewView::renderHints() {
-    for (const auto& [line, caption] : m_hintLines) {
-        QString hint = caption->hint.simplified();
-        // The long press stands in brackets: two signs of equality are no words.
-        if (const qsizetype held = hint.indexOf(u'='); held >= 0) {
-            QString press = hint.mid(held);
-            press.remove(u'=');
-            hint = hint.left(held).trimmed() + u" ("_s + press.simplified() + u')';
-        }
-        const QString name = caption->text.simplified();
-        line->setText(isolated(hint.isEmpty() || hint == name ? name : name + u": "_s + hint));
-    }
-    m_hintsClose->setText(wording(u"סגור"_s, u"Close"_s));
+    for (const auto& [line, caption] : m_hintLines)
+        line->setText(isolated(tFrmNew::hintLine(*caption)));
+    m_hintsClose->setText(m_shows.words.closeHints);
     m_hintsClose->setAccessibleName(m_hintsClose->text());
-    m_hints->setOpen(m_page.hintsAsLabels);
+    m_hints->setOpen(m_shows.hintsAsLabels);
 }
 
 // --- where they stand ---

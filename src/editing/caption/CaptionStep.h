@@ -1,0 +1,26 @@
+#pragma once
+
+#include <QColor>
+
+#include <cstdint>
+
+namespace lumora {
+
+struct EditFields;
+
+// The steps of the caption's keyboard, in the caption's fields of a record. Positions are in pixels of the preview;
+// what leaves 16 bits is held at the limit.
+namespace CaptionStep {
+
+inline constexpr std::int16_t step = 2; // of a held button: pixels, or points of the font
+
+// A caption where there was none: yellow, in 24 points of David, at (100, 100).
+void begin(EditFields& edit);
+void move(EditFields& edit, int right, int down);
+void resize(EditFields& edit, int points);
+void nextStyle(EditFields& edit); // regular, bold, italic, both
+void turn(EditFields& edit);      // across or down
+void colour(EditFields& edit, QRgb colour);
+
+} // namespace CaptionStep
+} // namespace lumora
