@@ -106,11 +106,10 @@ TEST_F(TheEditor, takesTheStepsOfItsClickedButtonsIntoTheRecord) {
                           Case{[&] { editor.Image18_Click(); }, EditRecord::RotationCode, "180"},
                           Case{[&] { hold(turnLeft, 3); }, EditRecord::RotationCode, "177"},
                           Case{[&] { editor.Image27_Click(); }, EditRecord::RotationCode, "180"},
-                          Case{[&] { holdImage2(3, 3); }, EditRecord::GainG, "0.87"},
-                          Case{[&] { holdImage2(4, 3); }, EditRecord::GainG, "0.99"},
-                          Case{[&] { editor.Image2_Click(6); }, EditRecord::GainR, "1.05"},
-                          Case{[&] { editor.Image2_Click(8); }, EditRecord::GainR, "0.99"},
-                          Case{[&] { editor.Image2_Click(10); }, EditRecord::GainB, "1.05"},
+                          Case{[&] { holdImage2(4, 5); }, EditRecord::GainG, "1.2 "},
+                          Case{[&] { editor.Image2_Click(6); }, EditRecord::GainR, "1.26"},
+                          Case{[&] { editor.Image2_Click(8); }, EditRecord::GainR, "1.2 "},
+                          Case{[&] { editor.Image2_Click(10); }, EditRecord::GainB, "1.26"},
                           Case{[&] { holdImage2(0, 80); }, EditRecord::ZoomPercent, "210"},
                           Case{[&] { holdImage2(1, 120); }, EditRecord::ZoomPercent, "40 "},
                           Case{[&] { editor.VScrollZ_Change(500); }, EditRecord::ZoomPercent, "40 "}}) {
@@ -120,6 +119,8 @@ TEST_F(TheEditor, takesTheStepsOfItsClickedButtonsIntoTheRecord) {
     EXPECT_EQ(shown().VScrollZ, tFrmNewControls::VScrollZMax);
     open(lying, recordWith(EditRecord::PanX, u"780"_s).replace(22, 4, u"-999"_s));
     hold(up, 1);
+    holdImage2(3, 3);
+    EXPECT_EQ(field(EditRecord::GainB), u"0.87"_s);
     EXPECT_EQ(state.edit.PanY, -1001);
     EXPECT_EQ(field(EditRecord::PanY), u"-100"_s);
 }
@@ -243,9 +244,12 @@ TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
 
 TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
     ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\bad.jpg"_s, "no picture"));
+    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\0.bmp"_s)); // where the work picture would be written
     open(lying);
+    open(standing);
+    EXPECT_EQ(machine.dialogs.messages.size(), 1) << "told once";
     tFrmNew& editor = open(u"C:\\p\\bad.jpg"_s);
-    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_FALSE(editor.pictureOpen());
     EXPECT_TRUE(paper().isNull());
     for (int index = 0; index < 11; ++index) {
@@ -333,14 +337,6 @@ TEST_F(TheEditor, showsCropMarkersThatStayAParallelogramAndCutNothing) {
     EXPECT_LT(shown().crop.marker(Corner::Picture11).y(), shown().crop.marker(Corner::Picture14).y());
     EXPECT_EQ(paper(), before);
     EXPECT_TRUE(stored.isEmpty());
-}
-
-TEST_F(TheEditor, tellsOnceThatTheWorkPictureCannotBeWritten) {
-    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\0.bmp"_s));
-    open(lying);
-    open(standing);
-    EXPECT_TRUE(page().pictureOpen());
-    EXPECT_EQ(machine.dialogs.messages.size(), 1);
 }
 
 TEST_F(TheEditor, keepsTheSmallViewInLogicalPixelsHoweverSharpTheScreen) {

@@ -147,15 +147,13 @@ TEST_P(RedEyeHands, OpensItsMenuByTheRightButtonALongPressAndAButton) {
     EXPECT_EQ(QPoint(page().sight().RedSearchX, page().sight().RedSearchY), before); // it was no pick
     press(u"Memokad"_s);
 
-    for (const QString& item : {u"Bsisi"_s, u"amok2"_s, u"amok3"_s, u"amok4"_s, u"amok5"_s, u"amok"_s, u"Command3"_s}) {
-        press(u"CommandMenu"_s);
-        press(item);
-        EXPECT_FALSE(page().controls().kofez.visible) << qPrintable(item);
-        EXPECT_TRUE(page().picture().RedChanged) << qPrintable(item);
-        press(u"CommandMenu"_s);
-        press(u"Rstor"_s);
-        EXPECT_FALSE(page().picture().RedChanged) << qPrintable(item);
-    }
+    press(u"CommandMenu"_s);
+    press(u"amok5"_s);
+    EXPECT_FALSE(page().controls().kofez.visible);
+    EXPECT_TRUE(page().picture().RedChanged);
+    press(u"CommandMenu"_s);
+    press(u"Rstor"_s);
+    EXPECT_FALSE(page().picture().RedChanged);
 }
 
 TEST_P(RedEyeHands, FollowsADragAndStopsAHoldWhenThePointerGoes) {
@@ -165,6 +163,9 @@ TEST_P(RedEyeHands, FollowsADragAndStopsAHoldWhenThePointerGoes) {
         ControlFinder(walk.program().window()).drag(u"RedI"_s, u"Picture1"_s, {60, 60}, {40, 60});
     ASSERT_TRUE(dragged.ok()) << qPrintable(dragged.failure().message);
     EXPECT_LT(page().sight().Picture1Left, left - 50);
+    const int before = page().sight().RedSearchX;
+    QTest::keyClick(&control(u"Picture1"_s), Qt::Key_Right);
+    EXPECT_EQ(page().sight().RedSearchX, before + RedI::arrowStep) << "a key is a tap of the arrow";
     QWidget& right = control(u"Image15"_s);
     QTest::mousePress(&right, Qt::LeftButton);
     EXPECT_TRUE(page().holds());

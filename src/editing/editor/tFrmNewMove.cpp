@@ -13,49 +13,15 @@ namespace lumora {
 // --- held buttons ---
 
 void tFrmNew::beginHold(Held what) {
-    constexpr int zoomStep = 2;
-    constexpr int brightnessStep = 4; // hundredths of a gain
-    constexpr int turnStep = 1;
-    constexpr int panStep = 2;
+    // In the order of Held. Zoom in percent, brightness in hundredths of a gain, places in pixels, turns in degrees.
+    const std::pair<Ticker&, int> steps[] = {{Timer2, 2},  {Timer2, -2}, {Timer3, -4}, {Timer3, 4}, {Timer7, 2},
+                                             {Timer7, -2}, {Timer8, -2}, {Timer8, 2},  {Timer6, 1}, {Timer6, -1}};
     stopHolds(); // a second finger takes over
     if (!m_open)
         return;
-    const auto begin = [this](Ticker& ticker, int step) {
-        m_step = step;
-        m_held.press(ticker);
-    };
-    switch (what) {
-    case Held::Closer:
-        begin(Timer2, zoomStep);
-        break;
-    case Held::Further:
-        begin(Timer2, -zoomStep);
-        break;
-    case Held::Darker:
-        begin(Timer3, -brightnessStep);
-        break;
-    case Held::Lighter:
-        begin(Timer3, brightnessStep);
-        break;
-    case Held::Right:
-        begin(Timer7, panStep);
-        break;
-    case Held::Left:
-        begin(Timer7, -panStep);
-        break;
-    case Held::Up:
-        begin(Timer8, -panStep);
-        break;
-    case Held::Down:
-        begin(Timer8, panStep);
-        break;
-    case Held::TurnRight:
-        begin(Timer6, turnStep);
-        break;
-    case Held::TurnLeft:
-        begin(Timer6, -turnStep);
-        break;
-    }
+    const auto& [ticker, step] = steps[static_cast<std::size_t>(what)];
+    m_step = step;
+    m_held.press(ticker);
     Q_EMIT changed();
 }
 
@@ -88,22 +54,11 @@ void tFrmNew::stopHolds() {
 }
 
 void tFrmNew::Image2_MouseDown(int index) {
-    switch (index) {
-    case 0:
-        beginHold(Held::Closer);
-        break;
-    case 1:
-        beginHold(Held::Further);
-        break;
-    case 3:
-        beginHold(Held::Darker);
-        break;
-    case 4:
-        beginHold(Held::Lighter);
-        break;
-    default:
+    const std::map<int, Held> held = {{0, Held::Closer}, {1, Held::Further}, {3, Held::Darker}, {4, Held::Lighter}};
+    const auto found = held.find(index);
+    if (found == held.end())
         return;
-    }
+    beginHold(found->second);
     if (m_held.isHeld())
         sunkImage2 = index;
 }

@@ -24,7 +24,6 @@ namespace {
 
 constexpr int holdPace = 100;
 constexpr int noticeTime = 4000;
-constexpr int arrowStep = 2;
 constexpr double tremble = 8; // units of the viewing area that a finger moves without meaning to drag
 const QStringList wheelSteps = {u"2"_s, u"0"_s, u"-2"_s};
 
@@ -40,10 +39,10 @@ RedI::RedI(SessionState& state, const Platform& platform, PageChain& chain)
     , m_platform(platform)
     , m_chain(chain)
     , Timer1(holdPace, [this] { resizeOnce(); })
-    , Timer2(holdPace, [this] { moveUp(); })
-    , Timer3(holdPace, [this] { moveDown(); })
-    , Timer4(holdPace, [this] { moveLeft(); })
-    , Timer5(holdPace, [this] { moveRight(); })
+    , Timer2(holdPace, [this] { moveCircle(Timer2, 0, -arrowStep); })
+    , Timer3(holdPace, [this] { moveCircle(Timer3, 0, arrowStep); })
+    , Timer4(holdPace, [this] { moveCircle(Timer4, -arrowStep, 0); })
+    , Timer5(holdPace, [this] { moveCircle(Timer5, arrowStep, 0); })
     , Timer7(noticeTime, [this] { hideNotice(); }) {}
 
 RedI::~RedI() = default;
@@ -181,22 +180,6 @@ void RedI::Arrow_MouseUp() {
         return;
     m_step = Step::Aim;
     setTexts();
-}
-
-void RedI::moveUp() {
-    moveCircle(Timer2, 0, -arrowStep);
-}
-
-void RedI::moveDown() {
-    moveCircle(Timer3, 0, arrowStep);
-}
-
-void RedI::moveLeft() {
-    moveCircle(Timer4, -arrowStep, 0);
-}
-
-void RedI::moveRight() {
-    moveCircle(Timer5, arrowStep, 0);
 }
 
 void RedI::moveCircle(const Ticker& timer, int right, int down) {

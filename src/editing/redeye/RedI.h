@@ -49,10 +49,11 @@ public:
     void Image14_MouseDown() { beginHold(Timer4); }
     void Image15_MouseDown() { beginHold(Timer5); }
     void Arrow_MouseUp();
-    void Timer2_Tick() { moveUp(); }
-    void Timer3_Tick() { moveDown(); }
-    void Timer4_Tick() { moveLeft(); }
-    void Timer5_Tick() { moveRight(); }
+    static constexpr int arrowStep = 2; // pixels of the picture, each 100 ms
+    void Timer2_Tick() { moveCircle(Timer2, 0, -arrowStep); }
+    void Timer3_Tick() { moveCircle(Timer3, 0, arrowStep); }
+    void Timer4_Tick() { moveCircle(Timer4, -arrowStep, 0); }
+    void Timer5_Tick() { moveCircle(Timer5, arrowStep, 0); }
     void CommandCloser_Click() { magnify(m_sight.Magnification * 2); }
     void CommandFurther_Click() { magnify(m_sight.Magnification / 2); }
 
@@ -128,10 +129,6 @@ private:
     void place(QPoint centre);
     void magnify(int to);
     void beginHold(Ticker& timer);
-    void moveUp();
-    void moveDown();
-    void moveLeft();
-    void moveRight();
     void moveCircle(const Ticker& timer, int right, int down);
     void holdSize(int step);
     void resizeOnce();

@@ -303,7 +303,6 @@ void RedIView::makeHelp() {
 }
 
 void RedIView::bindTheRest() {
-    RedI& page = m_page;
     bindHidden(u"kofez"_s, m_shows.kofez);
     bindHidden(u"RedTargetRectangle"_s, m_shows.RedTargetRectangle);
     bindHidden(u"Image1"_s, m_shows.Image1);

@@ -182,7 +182,7 @@ QWidget* tFrmNewView::makePlaceAndLight() {
     m_fineTurn = new ToolButton(theme(), u"turn-fine"_s, wide, turns);
     m_fineTurn->setObjectName(u"Frame4Opener"_s);
     connect(m_fineTurn, &QPushButton::clicked, this,
-            [this] { m_shows.Frame4.visible ? page.Image2_MouseMove() : page.Image15_MouseMove(); });
+            [this] { m_shows.Frame4.visible ? m_page.Image2_MouseMove() : m_page.Image15_MouseMove(); });
     turnRow->addWidget(m_fineTurn);
     static_cast<QVBoxLayout*>(turns->layout())->addLayout(turnRow);
 
