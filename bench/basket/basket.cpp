@@ -97,7 +97,7 @@ void WholeFolder(benchmark::State& state) {
     for (auto _ : state) {
         Basket basket;
         for (const QString& path : pager.paths().items()) {
-            if (basket.FindByPath9(path) < 0)
+            if (basket.FindByPath(path) < 0)
                 basket.append(line(1, path, LineForm::Short));
         }
         benchmark::DoNotOptimize(basket.SumCopies());

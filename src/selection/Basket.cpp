@@ -14,19 +14,6 @@ QString Basket::pathOf(const QString& line) const {
     return line.mid(BasketLine::pathColumn(m_form));
 }
 
-int Basket::FindByPath9(const QString& path) const {
-    if (m_form == LineForm::Short)
-        return FindByPath(path);
-    for (int i = 0; i < m_lines.count(); ++i) {
-        const QString& line = m_lines.items().at(i);
-        if (line.size() < shortestLine)
-            return -1;
-        if (QStringView(line).mid(PrintCode::width) == path)
-            return i;
-    }
-    return -1;
-}
-
 int Basket::FindByPath(const QString& path) const {
     if (!m_indexed)
         indexAll();

@@ -26,12 +26,8 @@ public:
     int currentIndex() const { return m_lines.currentIndex(); }
     void setCurrentIndex(int index) { m_lines.setCurrentIndex(index); }
 
-    // The first line equal to the text, else -1.
-    int FindExact(const QString& line) const { return m_lines.find(line); }
-    // The first line whose text from column 10 on is the path. A line of under 12 characters ends the search: it can
-    // only be part of a corrupted list.
-    int FindByPath9(const QString& path) const;
-    // The same in the basket's own form: from column 10 on, or from column 210 on.
+    // The first line of the path, which stands from column 10 on in the short form and from column 210 on in the full
+    // one. In the short form a line of under 12 characters ends the search: it can only be part of a corrupted list.
     int FindByPath(const QString& path) const;
 
     void clear();

@@ -4,6 +4,12 @@
 
 namespace lumora {
 
+AddressBox addressBoxOf(OrderKind kind, bool localStation) {
+    if (localStation)
+        return AddressBox::None;
+    return kind == OrderKind::Album ? AddressBox::AlbumMail : AddressBox::Mail;
+}
+
 CouponFit checkCoupon(int couponPictures, int total) {
     if (couponPictures < total)
         return CouponFit::TooMany;

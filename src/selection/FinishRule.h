@@ -1,8 +1,13 @@
 #pragma once
 
-#include <QString>
+#include "session/SessionState.h"
 
 namespace lumora {
+
+// What the closing panel asks for: the mail address in two boxes, that of an album order in one, or, at a local
+// station, none.
+enum class AddressBox { None, Mail, AlbumMail };
+AddressBox addressBoxOf(OrderKind kind, bool localStation);
 
 // A coupon order must match the coupon's quantity exactly, copies included.
 enum class CouponFit { Matches, TooMany, TooFew };

@@ -8,25 +8,19 @@
 
 namespace lumora {
 
-QString HandOverFiles::onePicName(int index) {
-    return QStringLiteral("%1onepic.txt").arg(index, 2, 10, QLatin1Char('0'));
-}
+using namespace Qt::StringLiterals;
 
-Result<void> HandOverFiles::write(const QStringList& lines, int index) const {
-    const QString folder = JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("Tik4txt"));
-    if (!m_files.folderExists(folder)) {
-        if (const Result<void> made = m_files.makeFolder(folder); !made)
-            return made;
-    }
-    QString all;
-    for (const QString& line : lines)
-        all += line + QStringLiteral("\r\n");
-    if (const Result<void> written =
-            m_files.writePassing(JoinDrivePath(folder, QStringLiteral("all_list.txt")), AnsiCodePage::encode(all));
-        !written)
-        return written;
-    return m_files.writePassing(JoinDrivePath(folder, onePicName(index)),
-                                AnsiCodePage::encode(lines.value(index) + QStringLiteral("\r\n")));
+Result<void> writeHandOverFiles(const SessionState& state, const Files& files, const QStringList& lines, int index) {
+    const QString folder = JoinDrivePath(WorkspacePaths::root(state), u"Tik4txt"_s);
+    Result<void> done = files.folderExists(folder) ? Result<void>() : files.makeFolder(folder);
+    const auto write = [&](const QString& name, const QStringList& of) {
+        if (done)
+            done =
+                files.writePassing(JoinDrivePath(folder, name), AnsiCodePage::encode(of.join(u"\r\n"_s) + u"\r\n"_s));
+    };
+    write(u"all_list.txt"_s, lines);
+    write(u"%1onepic.txt"_s.arg(index, 2, 10, QChar(u'0')), {lines.value(index)});
+    return done;
 }
 
 } // namespace lumora

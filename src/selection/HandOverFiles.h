@@ -9,24 +9,9 @@ namespace lumora {
 class Files;
 struct SessionState;
 
-// The texts that record the basket outside the page's memory, in 2000lumora\Tik4txt: the whole list, and the line of
-// the picture that was stored last in a file with its index in front ("07onepic.txt"). Nothing in the program reads
-// them.
-class HandOverFiles {
-public:
-    HandOverFiles(const SessionState& state, const Files& files)
-        : m_state(state)
-        , m_files(files) {}
-
-    // The folder is made when it is missing.
-    Result<void> write(const QStringList& lines, int index) const;
-
-    // The index with at least two digits, then "onepic.txt".
-    static QString onePicName(int index);
-
-private:
-    const SessionState& m_state;
-    const Files& m_files;
-};
+// Writes the texts that record the basket outside the page's memory, in 2000lumora\Tik4txt, which is made when it is
+// missing: all lines in "all_list.txt", and the line of the picture that was stored last in a file with its index in
+// front, of at least two digits ("07onepic.txt"). Nothing in the program reads them.
+Result<void> writeHandOverFiles(const SessionState& state, const Files& files, const QStringList& lines, int index);
 
 } // namespace lumora

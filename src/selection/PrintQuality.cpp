@@ -5,6 +5,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 PrintGrade printGrade(PictureSize size) {
     const auto pixels = static_cast<long long>(size.width) * size.height;
     if (pixels > 800000)
@@ -18,11 +20,11 @@ QString printGradeText(PrintGrade grade, PictureSize size, bool english) {
     const auto word = [&] {
         switch (grade) {
         case PrintGrade::Good:
-            return english ? QStringLiteral("  Quality  ") : QStringLiteral("  איכות  ");
+            return english ? u"  Quality  "_s : u"  איכות  "_s;
         case PrintGrade::Borderline:
-            return english ? QStringLiteral("  Borderline quality  ") : QStringLiteral("  איכות גבולית  ");
+            return english ? u"  Borderline quality  "_s : u"  איכות גבולית  "_s;
         case PrintGrade::VeryLow:
-            return english ? QStringLiteral("  Very low quality  ") : QStringLiteral("  איכות נמוכה מאוד  ");
+            return english ? u"  Very low quality  "_s : u"  איכות נמוכה מאוד  "_s;
         case PrintGrade::Unmarked:
             break;
         }
@@ -30,7 +32,7 @@ QString printGradeText(PrintGrade grade, PictureSize size, bool english) {
     };
     if (grade == PrintGrade::Unmarked)
         return {};
-    return word() + QString::number(size.height) + QStringLiteral(" / ") + QString::number(size.width);
+    return word() + QString::number(size.height) + u" / "_s + QString::number(size.width);
 }
 
 PictureSize largeViewSize(PictureSize picture) {

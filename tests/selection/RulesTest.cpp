@@ -2,6 +2,7 @@
 #include "selection/Basket.h"
 #include "selection/FinishRule.h"
 #include "selection/FolderPager.h"
+#include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
 #include "session/SessionState.h"
 
@@ -40,7 +41,6 @@ TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
         EXPECT_EQ(find("C:\\b.jpg"), -1);
         EXPECT_EQ(find("C:\\c.jpg"), 0);
         EXPECT_EQ(basket.SumCopies(), 6);
-        EXPECT_EQ(basket.FindExact(basket.item(1)), 1);
         basket.clear();
         EXPECT_EQ(find("C:\\a.jpg"), -1);
         EXPECT_EQ(basket.SumCopies(), 0);
@@ -52,10 +52,10 @@ TEST(ABasket, stopsItsSearchAtALineThatIsTooShort) {
     basket.append(plainLine(1, u"C:\\a.jpg"_s));
     basket.append(u"1 1015GNBC:"_s);
     basket.append(plainLine(1, u"C:\\b.jpg"_s));
-    EXPECT_EQ(basket.FindByPath9(u"C:\\a.jpg"_s), 0);
-    EXPECT_EQ(basket.FindByPath9(u"C:\\b.jpg"_s), -1);
+    EXPECT_EQ(basket.FindByPath(u"C:\\a.jpg"_s), 0);
+    EXPECT_EQ(basket.FindByPath(u"C:\\b.jpg"_s), -1);
     basket.removeAt(1);
-    EXPECT_EQ(basket.FindByPath9(u"C:\\b.jpg"_s), 1);
+    EXPECT_EQ(basket.FindByPath(u"C:\\b.jpg"_s), 1);
 }
 
 TEST(ABasket, holdsTheSumOfCopiesAtWhatAFieldOf16BitsTakes) {
@@ -124,6 +124,92 @@ TEST(AFolderPager, goesBackByThePageInViewAndTheOneBefore) {
     }
 }
 
+// Fourteen pictures, the first twelve of them in the cells.
+struct Choosing {
+    explicit Choosing(LineForm form = LineForm::Short) {
+        order.ppr = u"10/15"_s;
+        order.maat = u"מבריק"_s;
+        order.Bord = u"NB"_s;
+        choice.setForm(form);
+        choice.addFolder(u"C:\\p"_s, names(14));
+        choice.nextPage();
+    }
+    QStringList lines() const { return choice.basket().lines().items(); }
+
+    OrderDetails order;
+    PictureChoice choice{order};
+};
+
+TEST(AChoice, keepsCopiesAndPlaceOfAPictureThatIsChosenAgain) {
+    Choosing at;
+    at.choice.choose(2, {});
+    at.choice.choose(0, {});
+    at.choice.setCopies(2, 12, {});
+    at.order.ppr = u"13/18"_s;
+    EXPECT_EQ(at.lines(), QStringList({u"121015GNBC:\\p\\03.jpg"_s, u"1 1015GNBC:\\p\\01.jpg"_s}));
+    at.choice.choose(2, {});
+    EXPECT_EQ(at.lines().first(), u"121318GNBC:\\p\\03.jpg"_s);
+    at.choice.setCopies(2, 100, {});
+    EXPECT_EQ(at.lines().first(), u"991318GNBC:\\p\\03.jpg"_s);
+    at.choice.setCopies(2, 0, {});
+    EXPECT_EQ(at.lines(), QStringList(u"1 1015GNBC:\\p\\01.jpg"_s));
+    at.choice.choose(2, {});
+    EXPECT_EQ(at.choice.copies(2), 1);
+}
+
+TEST(AChoice, isMarkedOnEachPageThatHasItsPictures) {
+    Choosing at;
+    at.choice.choose(1, {});
+    at.choice.setCopies(1, 2, {});
+    at.choice.nextPage();
+    EXPECT_FALSE(at.choice.chosen(1));
+    at.choice.choose(0, {});
+    at.choice.previousPage();
+    EXPECT_EQ(at.choice.copies(1), 2);
+    EXPECT_FALSE(at.choice.chosen(0));
+    at.choice.chosenPage();
+    EXPECT_EQ(at.choice.page().items(), QStringList({u"C:\\p\\02.jpg"_s, u"C:\\p\\13.jpg"_s}));
+    EXPECT_EQ(at.choice.copies(0), 2);
+}
+
+TEST(AChoice, countsEachOfTwoCellsWithTheSamePictureByItself) {
+    Choosing at;
+    at.choice.clear();
+    for (int i = 0; i < 2; ++i)
+        at.choice.addFolder(u"C:\\q"_s, names(1));
+    at.choice.nextPage();
+    at.choice.choose(0, {});
+    at.choice.setCopies(0, 5, {});
+    at.choice.choose(1, {});
+    EXPECT_EQ(at.lines(), QStringList(u"1 1015GNBC:\\q\\01.jpg"_s)) << "the count of the cell that was pressed last";
+    EXPECT_EQ(at.choice.copies(0), 5);
+}
+
+TEST(AChoice, ofTheWholeFolderIsOneCopyOfEachWithTheLetterBeforeForAWordItDoesNotKnow) {
+    Choosing at;
+    at.choice.choose(3, {});
+    at.choice.setCopies(3, 7, {});
+    at.order.maat = u"Matte"_s;
+    at.choice.chooseAll();
+    EXPECT_EQ(at.lines().size(), 14);
+    EXPECT_EQ(at.choice.basket().SumCopies(), 14);
+    EXPECT_EQ(at.lines().first(), u"1 1015GNBC:\\p\\04.jpg"_s);
+}
+
+TEST(AChoice, carriesTheRecordOfAPictureWhateverPageIsInView) {
+    Choosing at(LineForm::Full);
+    const QString edited = QString(EditRecord::newPicture()).replace(15, 3, u"130"_s);
+    EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), -1);
+    at.choice.choose(4, EditRecord::newPicture());
+    at.choice.choose(0, EditRecord::newPicture());
+    at.choice.setCopies(0, 2, {});
+    at.choice.nextPage();
+    EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), 1);
+    EXPECT_EQ(at.lines().last(), u"2 1015GNB"_s + edited + u"C:\\p\\01.jpg"_s);
+    EXPECT_EQ(at.choice.recordOf(u"C:\\p\\01.jpg"_s), edited);
+    EXPECT_EQ(at.choice.recordOf(u"C:\\p\\02.jpg"_s), std::nullopt);
+}
+
 TEST(APrintGrade, goesByThePixelCountAlone) {
     struct Case {
         PictureSize size;
@@ -158,6 +244,9 @@ TEST(AFinish, compressesLargePrintsAsThePolicySays) {
         EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 1), c.asking) << c.paper;
         EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 2), c.always) << c.paper;
     }
+    EXPECT_EQ(addressBoxOf(OrderKind::EditedPrint, false), AddressBox::Mail);
+    EXPECT_EQ(addressBoxOf(OrderKind::Album, false), AddressBox::AlbumMail);
+    EXPECT_EQ(addressBoxOf(OrderKind::Album, true), AddressBox::None);
     EXPECT_EQ(checkCoupon(220, 221), CouponFit::TooMany);
     EXPECT_EQ(checkCoupon(220, 219), CouponFit::TooFew);
     EXPECT_EQ(checkCoupon(220, 220), CouponFit::Matches);

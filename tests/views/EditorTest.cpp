@@ -71,7 +71,7 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
     walk.press(editor, u"Strip(3)"_s);
     walk.settle(300);
     look(walk, u"35-other-picture"_s);
-    EXPECT_EQ(walk.page<kyoskNew>(PageId::kyoskNew).List1.count(), 2);
+    EXPECT_EQ(walk.page<kyoskNew>(PageId::kyoskNew).controls().List1.count(), 2);
     walk.press(editor, u"CommandDone"_s);
     walk.waitFor(u"kyoskNew"_s);
     look(walk, u"36-pictures-edited"_s);
@@ -85,7 +85,7 @@ TEST(EditorByMouse, HoldsDragsAndTaps) {
     auto& edit = walk.program().state().edit;
     const ControlFinder finder(walk.program().window());
     const QString editor = u"tFrmNew"_s;
-    const auto record = [&] { return walk.page<kyoskNew>(PageId::kyoskNew).List1.item(0).mid(9, 200); };
+    const auto record = [&] { return walk.page<kyoskNew>(PageId::kyoskNew).controls().List1.item(0).mid(9, 200); };
 
     walk.press(editor, u"Image2(0)"_s);
     EXPECT_EQ(page.controls().Label11.text, u"102"_s) << "a tap is one step";

@@ -1,26 +1,37 @@
 #include "selection/pictures/kyoskNew.h"
 
+#include "common/DrivePathText.h"
+#include "common/FixedText.h"
+#include "editing/editor/tFrmNew.h"
 #include "order/EditRecord.h"
 #include "platform/Dialogs.h"
+#include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& chain)
-    : Page(PageId::kyoskNew)
+    : Page(pageId)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
-    , File1(platform.files, QStringLiteral("*.jpg"))
-    , Timer1(40, [this] { Timer1_Tick(); })
-    , Timer2(500, [this] { Timer2_Tick(); }) {}
+    , m_choice(state.shemot)
+    , File1(platform.files, u"*.jpg"_s)
+    , Timer1(40, [this] { moveLabel35(); })
+    , Timer2(500, [this] { movePointers(); }) {}
 
 kyoskNew::~kyoskNew() = default;
 
 bool kyoskNew::plain() const {
     return printsAsTheyAre(m_state.Optint);
+}
+
+AddressBox kyoskNew::addressBox() const {
+    return addressBoxOf(m_state.Optint, m_state.TachanaMekomit);
 }
 
 void kyoskNew::load() {
@@ -29,56 +40,91 @@ void kyoskNew::load() {
     m_state.edit.PicturePath.clear();
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
     m_state.BranchChoice.clear();
-    List1.setForm(lineFormOf(m_state.Optint));
+    m_choice.setForm(lineFormOf(m_state.Optint));
 
-    for (Caption* hidden : {&Frame2, &Pic4Brose, &Picture66, &Label35, &Label36, &Image19, &Image20, &editorView,
-                            &Frame3, &PicB4Sioom, &Frame4, &Pic4snifim, &Pic4Snif, &Picture7, &Txt4Ml2, &Label24})
-        hidden->visible = false;
     // An album order has a finish of its own, until the whole folder is taken.
     Image13.visible = m_state.Optint == OrderKind::Album;
     Image7.visible = !Image13.visible;
     const bool coupon = m_state.coupon.HaKoopon == 1;
     for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3, &Label4kpn3Prompt})
         couponOnly->visible = coupon;
-    const bool asksAddress = !m_state.TachanaMekomit;
-    for (Caption* address : {&Label33, &Label17, &Text1, &Combo1, &Command8})
-        address->visible = asksAddress;
+    const AddressBox box = addressBox();
+    Text1.visible = Combo1.visible = box == AddressBox::Mail;
+    Txt4Ml2.visible = box == AddressBox::AlbumMail;
+    Label17.visible = Command8.visible = box != AddressBox::None;
+    Label33.visible = box != AddressBox::None && !m_state.DoarReshut;
 
-    clearCells();
-    SumCopies();
-    if (!plain())
-        loadEditor();
+    showChoice();
+    if (plain())
+        return;
+    // Once an order, with this page.
+    m_chain.load<tFrmNew>();
+    connect(&editor(), &tFrmNew::stored, this, &kyoskNew::storeRecord);
+    connect(&editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);
+    connect(&editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
 }
 
-void kyoskNew::takeFocus(const QString& box) {
-    focusBox = box;
-    ++focusRequest;
-}
-
-void kyoskNew::say(const QString& hebrew, const QString& english) {
+void kyoskNew::say(const char16_t* hebrew, const char16_t* english) {
     m_platform.dialogs.message(m_state.wording(hebrew, english));
 }
 
-void kyoskNew::Image10_Click() {
-    if (Val16(Label7.text) == 0) {
-        m_chain.endProgram();
-        return;
+// Lists and cells show what the choice holds.
+void kyoskNew::showChoice() {
+    List1 = m_choice.basket().lines();
+    List2 = m_choice.page();
+    List4 = m_choice.folders().paths();
+    Label7.text = QString::number(m_choice.basket().SumCopies());
+    for (int cell = 0; cell < cellsOfPage; ++cell) {
+        const auto at = static_cast<std::size_t>(cell);
+        const QString path = m_choice.path(cell);
+        const QString copies = QString::number(m_choice.copies(cell));
+        const QString name = LeafName(path);
+        const auto words = [&](const char16_t* hebrew, const char16_t* english) {
+            return m_state.wording(hebrew, english).arg(name);
+        };
+        Picture1[at].text = path;
+        Picture4[at].visible = m_choice.chosen(cell);
+        Label4[at].text = copies;
+        Label5[at].text = path.isEmpty() ? u"*"_s : RightPart(path, 20);
+        Picture1[at].spoken =
+            path.isEmpty() ? m_state.wording(u"תא ריק", u"Empty place")
+            : m_choice.chosen(cell)
+                ? m_state.wording(u"%1, נבחרה, עותקים: %2", u"%1, chosen, copies: %2").arg(name, copies)
+            : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
+                      : words(u"%1, לחץ לעריכה", u"%1, press to edit");
+        Command12[at].spoken = words(u"עותק נוסף של %1", u"One more copy of %1");
+        Command13[at].spoken = words(u"עותק אחד פחות של %1", u"One copy less of %1");
     }
+    Q_EMIT changed();
+}
+
+void kyoskNew::setScreenHeight(int pixels) {
+    m_cellSize = pixels < 700 ? 90 : 115;
+}
+
+void kyoskNew::askToLeave() {
+    if (m_choice.basket().SumCopies() == 0)
+        return endProgram();
     Frame3.visible = true;
     Q_EMIT changed();
 }
 
-void kyoskNew::Image23_Click() {
+void kyoskNew::endProgram() {
     m_chain.endProgram();
 }
 
-void kyoskNew::Command15_Click() {
-    m_chain.endProgram();
-}
-
-void kyoskNew::Command4_Click() {
+void kyoskNew::stay() {
     Frame3.visible = false;
     Q_EMIT changed();
+}
+
+void kyoskNew::turnHelp() {
+    Frame2.visible = !Frame2.visible;
+    Q_EMIT changed();
+}
+
+void kyoskNew::openPriceList() {
+    m_platform.shell.openWebPage(m_state.profile.PriceListUrl);
 }
 
 } // namespace lumora

@@ -18,23 +18,15 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 // Drawn between two pumps: as many as a small machine has cores.
 constexpr int drawnAtOnce = 2;
-constexpr int smallScreen = 700;
-
-HostPath hostOf(const Platform& platform, const QString& path) {
-    return platform.files.drives().toHost(path).value_or(HostPath());
-}
 } // namespace
 
-void kyoskNew::setScreenHeight(int pixels) {
-    const int size = pixels < smallScreen ? 90 : 115;
-    if (size == cellSize)
-        return;
-    cellSize = size;
-    Label4FontSize = pixels < smallScreen ? 12 : 0;
-    Q_EMIT changed();
+HostPath kyoskNew::hostOf(const QString& path) const {
+    return m_platform.files.drives().toHost(path).value_or(HostPath());
 }
 
 void kyoskNew::setCellPixels(int pixels) {
@@ -57,21 +49,14 @@ void kyoskNew::setCellPixels(int pixels) {
 void kyoskNew::turnPage(const std::function<void()>& step) {
     for (CellPicture& picture : Picture1)
         picture.visible = false;
-    setKeysPlain();
+    m_openCell = -1;
     step();
     for (CellPicture& picture : Picture1)
         picture.visible = true;
     Q_EMIT changed();
 }
 
-void kyoskNew::setKeysPlain() {
-    for (KeyCaption& key : Command12)
-        key.colour = KeyColour::System;
-    for (KeyCaption& key : Command13)
-        key.colour = KeyColour::System;
-}
-
-void kyoskNew::Image5_Click() {
+void kyoskNew::addFolder() {
     if (m_picking || m_handedOver)
         return;
     m_picking = true;
@@ -79,20 +64,9 @@ void kyoskNew::Image5_Click() {
     m_picking = false;
 }
 
-void kyoskNew::Image16_Click() {
-    turnPage([this] { ShowPage(); });
-}
-
-void kyoskNew::Image15_Click() {
-    turnPage([this] {
-        List4.PageBack();
-        ShowPage();
-    });
-}
-
-void kyoskNew::Command14_Click() {
-    turnPage([this] {
-        FillChosenPage();
+void kyoskNew::turnTo(void (PictureChoice::*page)()) {
+    turnPage([&] {
+        (m_choice.*page)();
         drawPage();
     });
 }
@@ -101,20 +75,20 @@ void kyoskNew::pickFolder() {
     Pic4Brose.visible = true;
     Q_EMIT changed();
     m_platform.pump.pump();
-    const QString prompt =
-        m_state.wording(QStringLiteral("בחר תמונה אחת בלבד "), QStringLiteral("Select one image only"));
-    const QString picture = m_platform.dialogs.pickFile(prompt, m_state.DiskRoot, QStringLiteral("Open"));
+    const QString prompt = m_state.wording(u"בחר תמונה אחת בלבד ", u"Select one image only");
+    const QString picture = m_platform.dialogs.pickFile(prompt, m_state.DiskRoot, u"Open"_s);
     Pic4Brose.visible = false;
     Q_EMIT changed();
 
     if (plain() && HasQuestionMark(picture)) {
-        m_platform.dialogs.message(
-            QStringLiteral("File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"));
+        m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
         return;
     }
     if (picture.isEmpty()) {
-        if (!List4.isEmpty())
+        if (!m_choice.folders().isEmpty()) {
+            m_choice.markPage();
             drawPage();
+        }
         return;
     }
     showFolderOf(picture);
@@ -122,13 +96,14 @@ void kyoskNew::pickFolder() {
 
 void kyoskNew::showFolderOf(const QString& picture) {
     takeFolderOf(picture);
-    if (List4.isEmpty())
+    if (m_choice.folders().isEmpty())
         return;
     Frame1.visible = true;
     if (m_state.Optint == OrderKind::Sequence || m_state.Optint == OrderKind::Album)
         showFolderOffer();
     showGuide(Guide::PicturesShown);
-    ShowPage();
+    m_choice.nextPage();
+    drawPage();
 }
 
 void kyoskNew::takeFolderOf(const QString& picture) {
@@ -136,13 +111,20 @@ void kyoskNew::takeFolderOf(const QString& picture) {
     if (folder.size() <= 2)
         folder += u'\\'; // a drive root: its path alone ends in a backslash
     File1.setFolder(folder);
-    List4.addFolder(folder, File1.names());
-    Label34.text = QString::number(List4.count());
+    m_choice.addFolder(folder, File1.names());
     Label29.text = folder;
+    showPictureCount();
     if (File1.count() == 0)
-        say(QStringLiteral("לא נמצאו תמונות JPG בתיקייה\n") + folder + QStringLiteral("\nבחר תמונה מתיקייה אחרת"),
-            QStringLiteral("There are no JPG pictures in the folder\n") + folder +
-                QStringLiteral("\nSelect a picture of another folder"));
+        m_platform.dialogs.message(m_state
+                                       .wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
+                                                u"There are no JPG pictures in the folder\n%1\nSelect a picture of "
+                                                u"another folder")
+                                       .arg(folder));
+}
+
+void kyoskNew::showPictureCount() {
+    Label34.text = QString::number(m_choice.folders().count());
+    pictureCount.text = m_state.wording(u"%1 תמונות", u"%1 pictures").arg(Label34.text);
 }
 
 void kyoskNew::showFolderOffer() {
@@ -154,66 +136,19 @@ void kyoskNew::showFolderOffer() {
     Timer2.start();
 }
 
-void kyoskNew::Timer1_Tick() {
-    label35Left = std::min(label35Left + 10, 300);
-    if (label35Left == 300)
-        Timer1.stop();
-    Q_EMIT changed();
-}
-
-void kyoskNew::Timer2_Tick() {
-    pointerStep = (pointerStep + 1) % 4;
-    Q_EMIT changed();
-}
-
-void kyoskNew::ShowPage() {
-    List2.clear();
-    List2.append(List4.FillPageList());
-    drawPage();
-}
-
-void kyoskNew::FillChosenPage() {
-    // The list of a basket that was never paged stands before its first line; a page of chosen pictures begins with it.
-    int index = std::max(List1.currentIndex(), 0);
-    const int column = BasketLine::pathColumn(List1.form());
-    const QStringList page = FillPage(List1.lines().items(), index, [column](const QString& line) {
-        return line.trimmed().isEmpty() ? QString() : line.mid(column);
-    });
-    List1.setCurrentIndex(index);
-    List2.clear();
-    List2.append(page);
-}
-
 void kyoskNew::drawPage() {
     clearCells();
-    markChosen();
+    showChoice();
     drawCells();
 }
 
 void kyoskNew::clearCells() {
-    for (std::size_t cell = 0; cell < cellsOfPage; ++cell) {
-        Picture1[cell].bitmap = Bitmap();
-        Picture4[cell].visible = false;
-        Label4[cell].text = QStringLiteral("0");
-        Label5[cell].text = QStringLiteral("*");
-    }
+    for (CellPicture& picture : Picture1)
+        picture.bitmap = Bitmap();
 }
 
-// Each line is looked at by itself: the fields of the picture that is open in the editor stay what they are.
-void kyoskNew::markChosen() {
-    for (int i = 0; i < List2.count(); ++i) {
-        const auto cell = static_cast<std::size_t>(i);
-        Label5[cell].text = RightPart(List2.item(i), 20);
-        if (const int index = List1.FindByPath(List2.item(i)); index >= 0) {
-            Picture4[cell].visible = true;
-            Label4[cell].text = QString::number(PrintCode::copiesOf(List1.item(index)));
-        }
-    }
-}
-
-QString kyoskNew::pictureToDraw(int cell) const {
-    const QString path = List2.item(cell);
-    if (!plain() && List1.FindByPath(path) >= 0) {
+QString kyoskNew::pictureToDraw(const QString& path) const {
+    if (!plain() && m_choice.inBasket(path)) {
         const QString stored = StoredSmallView::path(m_state, path);
         if (m_platform.files.fileExists(stored))
             return stored;
@@ -227,7 +162,7 @@ void kyoskNew::drawCells() {
         const int behind = std::min(first + drawnAtOnce, List2.count());
         std::vector<HostPath> paths;
         for (int cell = first; cell < behind; ++cell)
-            paths.push_back(hostOf(m_platform, pictureToDraw(cell)));
+            paths.push_back(hostOf(pictureToDraw(m_choice.path(cell))));
         std::vector<Result<Bitmap>> pictures = loadSmallPictures(paths, m_cellPixels);
         for (int cell = first; cell < behind; ++cell) {
             // A file that can't be read leaves its cell empty, and the page goes on.
@@ -244,24 +179,24 @@ void kyoskNew::drawCells() {
     Q_EMIT changed();
 }
 
-void kyoskNew::repaintStored(const QString& path) {
+void kyoskNew::repaint(const QString& path) {
     for (int cell = 0; cell < List2.count(); ++cell) {
         if (List2.item(cell) != path)
             continue;
-        std::vector<Result<Bitmap>> pictures =
-            loadSmallPictures({hostOf(m_platform, pictureToDraw(cell))}, m_cellPixels);
+        std::vector<Result<Bitmap>> pictures = loadSmallPictures({hostOf(pictureToDraw(path))}, m_cellPixels);
         if (pictures.front())
             Picture1[static_cast<std::size_t>(cell)].bitmap = std::move(*pictures.front());
     }
+    Q_EMIT changed();
 }
 
 void kyoskNew::showLarge(const QString& path) {
-    const HostPath host = hostOf(m_platform, path);
+    const HostPath host = hostOf(path);
     const Result<PictureSize> size = readPictureSize(host);
     if (!size)
         return;
     const PictureSize view = largeViewSize(*size);
-    const double scale = static_cast<double>(m_cellPixels) / cellSize;
+    const double scale = static_cast<double>(m_cellPixels) / m_cellSize;
     const auto pixels = [scale](int units) { return std::max(1, static_cast<int>(std::lround(units * scale))); };
     // A quarter turn exchanges the sides of the view; the picture keeps its proportions.
     const Result<Bitmap> picture = loadPictureScaled(host, {pixels(view.width), pixels(view.height)});
@@ -269,46 +204,30 @@ void kyoskNew::showLarge(const QString& path) {
         return;
     Picture2.bitmap =
         m_rotation == 0 ? *picture : Bitmap(picture->image().transformed(QTransform().rotate(m_rotation)));
+    Image4.visible = true;
     m_guide = Guide::None;
     Picture2.guide.clear();
 
     const PrintGrade grade = printGrade(*size);
-    Picture2.warning = grade == PrintGrade::Borderline || grade == PrintGrade::VeryLow;
+    Picture2.poor = grade == PrintGrade::Borderline || grade == PrintGrade::VeryLow;
     if (grade != PrintGrade::Unmarked) {
         m_grade = grade;
         m_gradedSize = *size;
-        showGrade();
+        Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
     }
 }
 
-void kyoskNew::showGrade() {
-    Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
-}
-
-void kyoskNew::Image4_Click() {
+void kyoskNew::turnLargeView() {
     m_rotation = (m_rotation + 90) % 360;
     showLarge(Label2.text);
     Q_EMIT changed();
 }
 
-void kyoskNew::Picture2_Click() {
+void kyoskNew::lookInLarge() {
     if (Picture2.bitmap.isNull())
         return;
     m_chain.load<Form3>().open(Label2.text);
-    m_chain.follow(PageId::kyoskNew, Outcome::TurnedWanted);
-}
-
-void kyoskNew::Image6_Click() {
-    Frame2.visible = !Frame2.visible;
-    Q_EMIT changed();
-}
-
-void kyoskNew::Image11_Click() {
-    m_platform.shell.openWebPage(m_state.profile.PriceListUrl);
-}
-
-void kyoskNew::Image17_Click() {
-    Image11_Click();
+    m_chain.follow(pageId, Outcome::TurnedWanted);
 }
 
 } // namespace lumora

@@ -5,67 +5,85 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
+struct kyoskNew::Words {
+    Caption& caption;
+    const char16_t* hebrew;
+    const char16_t* english;
+    const char16_t* hebrewHint = u"";
+    const char16_t* englishHint = u"";
+};
+
+void kyoskNew::setWords(std::initializer_list<Words> all) {
+    for (const Words& words : all) {
+        words.caption.text = m_state.wording(words.hebrew, words.english);
+        words.caption.hint = m_state.wording(words.hebrewHint, words.englishHint);
+    }
+}
+
 void kyoskNew::setTexts() {
     setBrowserTexts();
     setClosingTexts();
     showGuide(m_guide);
-    showGrade();
-    Q_EMIT changed();
+    if (m_grade != PrintGrade::Unmarked)
+        Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
+    if (!Label34.text.isEmpty())
+        showPictureCount();
+    showChoice();
 }
 
 void kyoskNew::setBrowserTexts() {
-    const auto set = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.text = m_state.wording(hebrew, english);
-    };
-    const auto setHint = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.hint = m_state.wording(hebrew, english);
-    };
-
-    Label15.text = m_state.shemot.ppr;
-    Label18.text = m_state.shemot.ppr;
+    Label15.text = Label18.text = m_state.shemot.ppr;
     if (plain())
-        set(Title, u"בחירת תמונות", u"Choose your pictures");
+        setWords({{Title, u"בחירת תמונות", u"Choose your pictures"}});
     else
-        set(Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it");
-    set(Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
-        u"Your pictures will show here\nPress Add pictures and select one picture of the folder");
-    set(Label7Prompt, u"עותקים", u"Copies");
-    set(Label34Prompt, u"תמונות בתיקייה", u"Pictures found");
-    set(Label25, u"זכור\nעליך לבחור רק תמונה אחת\nוהתוכנה תציג את כל התמונות ",
-        u"Please Be Note\nSelect one image only\nand the program will Show \nall the Chocen Folder Images");
-
-    set(Image4, u"סובב", u"Turn");
-    setHint(Image4, u"סובב את התצוגה. ההדפסה אינה משתנה", u"Turns the view only; the print does not change");
-    set(Image5, u"הוסף תמונות", u"Add pictures");
-    setHint(Image5, u"הוסף תמונות מתיקייה נוספת", u"Adds the pictures of a further folder");
-    set(Image6, u"עזרה", u"Help");
-    set(Image7, u"סיים ושלח", u"Finish Order And Send");
-    set(Image8, u"בטל בחירה בדף זה", u"Cancel this page");
-    setHint(Image8, u"מבטל את כל התמונות שנבחרו בדף זה", u"Cancels all pictures chosen on this page");
-    set(Image10, u"יציאה", u"Leave");
-    set(Image11, u"מחירון", u"Price list");
-    set(Image13, u"סיים ושלח", u"Finish Order And Send");
-    setHint(Image13, u"סיום הזמנת האלבום", u"Finishes the album order");
-    set(Image15, u"הקודמות", u"Previous");
-    setHint(Image15, u"תמונות קודמות", u"Previous pictures");
-    set(Image16, u"הבאות", u"Next");
-    setHint(Image16, u"תמונות הבאות", u"Next pictures");
-    set(Image17, u"מחירון", u"Price list");
-    set(Image23, u"סגור את התוכנה", u"End the program");
-    set(Command11, u"הסר כפילויות", u"Drop duplicates");
-    setHint(Command11, u"תמונה שנבחרה פעמיים תופיע פעם אחת",
-            u"A picture that stands twice in the basket will stand once");
-    set(Command14, u"הצג רק מה שנבחר", u"Show only what was chosen");
-    for (KeyCaption& plus : Command12) {
-        plus.text = QStringLiteral("+");
-        setHint(plus, u"עותק נוסף", u"One copy more");
-    }
-    for (KeyCaption& minus : Command13) {
-        minus.text = QStringLiteral("−");
-        setHint(minus, u"עותק פחות, או ביטול הבחירה", u"One copy less, or not at all");
-    }
-
-    set(Frame2, u"עזרה", u"Help");
+        setWords({{Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it"}});
+    setWords({
+        {Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
+         u"Your pictures will show here\nPress Add pictures and select one picture of the folder"},
+        {Label7Prompt, u"עותקים", u"Copies"},
+        {Label34Prompt, u"תמונות בתיקייה", u"Pictures found"},
+        {Label25, u"זכור\nעליך לבחור רק תמונה אחת\nוהתוכנה תציג את כל התמונות ",
+         u"Please Be Note\nSelect one image only\nand the program will Show \nall the Chocen Folder Images"},
+        {Image4, u"סובב", u"Turn", u"סובב את התצוגה. ההדפסה אינה משתנה",
+         u"Turns the view only; the print does not change"},
+        {Image5, u"הוסף תמונות", u"Add pictures", u"הוסף תמונות מתיקייה נוספת",
+         u"Adds the pictures of a further folder"},
+        {Image6, u"עזרה", u"Help"},
+        {Image7, u"סיים ושלח", u"Finish Order And Send"},
+        {Image8, u"בטל בחירה בדף זה", u"Cancel this page", u"מבטל את כל התמונות שנבחרו בדף זה",
+         u"Cancels all pictures chosen on this page"},
+        {Image10, u"יציאה", u"Leave"},
+        {Image11, u"מחירון", u"Price list"},
+        {Image13, u"סיים ושלח", u"Finish Order And Send", u"סיום הזמנת האלבום", u"Finishes the album order"},
+        {Image15, u"הקודמות", u"Previous", u"תמונות קודמות", u"Previous pictures"},
+        {Image16, u"הבאות", u"Next", u"תמונות הבאות", u"Next pictures"},
+        {Image17, u"מחירון", u"Price list"},
+        {Image23, u"סגור את התוכנה", u"End the program"},
+        {Command11, u"הסר כפילויות", u"Drop duplicates", u"תמונה שנבחרה פעמיים תופיע פעם אחת",
+         u"A picture that stands twice in the basket will stand once"},
+        {Command14, u"הצג רק מה שנבחר", u"Show only what was chosen"},
+        {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
+        {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
+        {Frame2, u"עזרה", u"Help"},
+        {helpClose, u"סגור", u"Close"},
+        {Picture66, u"שליחת תיקייה שלמה", u"Send a whole folder"},
+        {Label35, u"האם לשלוח את כל התיקייה?", u"Send the whole folder?"},
+        {Label36, u"בחר כאן כיצד להמשיך", u"Choose here how to go on"},
+        {Command24, u"מעוניין לשלוח את כל התיקייה במלואה", u"I want to send the whole folder"},
+        {Command25, u"לא את כל התיקייה, אבחר בעצמי", u"Not all of it, I will choose"},
+        {Command23, u"התחרטתי רוצה לשלוח תיקייה אחרת ", u"Changed my mind, I want another folder"},
+        {Command26[0], u"כן", u"Yes"},
+        {Command26[1], u"לא", u"No"},
+    });
+    for (SpokenCaption& plus : Command12)
+        setWords({{plus, u"+", u"+", u"עותק נוסף", u"One copy more"}});
+    for (SpokenCaption& minus : Command13)
+        setWords({{minus, u"−", u"−", u"עותק פחות, או ביטול הבחירה", u"One copy less, or not at all"}});
+    Picture2.warning =
+        m_state.wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת", u"Few pixels: the print may come out blurred");
+    Picture2.spoken = m_state.wording(u"הצגת התמונה בגדול", u"Look at the picture in large");
     Label9.text = (plain() ? m_state.wording(u"לחיצה על תמונה קטנה בוחרת אותה ומציגה אותה בגדול\n",
                                              u"A click on a small picture chooses it and shows it large\n")
                            : m_state.wording(u"לחיצה על תמונה קטנה בוחרת אותה ופותחת אותה לעריכה\n",
@@ -82,66 +100,54 @@ void kyoskNew::setBrowserTexts() {
         m_state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה", u"Select only one image of a folder");
     Pic4BroseLines = {once, all, fromFolder, once, all, fromFolder};
     Pic4Brose.text = once;
-
-    set(Picture66, u"שליחת תיקייה שלמה", u"Send a whole folder");
-    set(Label35, u"האם לשלוח את כל התיקייה?", u"Send the whole folder?");
-    set(Label36, u"בחר כאן כיצד להמשיך", u"Choose here how to go on");
-    set(Command24, u"מעוניין לשלוח את כל התיקייה במלואה", u"I want to send the whole folder");
-    set(Command25, u"לא את כל התיקייה, אבחר בעצמי", u"Not all of it, I will choose");
-    set(Command23, u"התחרטתי רוצה לשלוח תיקייה אחרת ", u"Changed my mind, I want another folder");
-    set(Command26[0], u"כן", u"Yes");
-    set(Command26[1], u"לא", u"No");
 }
 
 void kyoskNew::setClosingTexts() {
-    const auto set = [this](Caption& caption, const char16_t* hebrew, const char16_t* english) {
-        caption.text = m_state.wording(hebrew, english);
-    };
-
-    set(Frame3, u"יציאה", u"Leaving");
-    set(Label11,
-        u"בחרת תמונות למשלוח והנך מבקש לצאת\n"
-        u"אם ברצונך לצאת לחץ על יציאה\n"
-        u"אם ברצונך לשלוח את התמונות להדפסה\n"
-        u"לחץ על סיים ושלח",
-        u"You have chosen to leave this program,\n"
-        u"but you did select images.\n"
-        u"In case you want leave press EXIT.\n"
-        u"If you want to send the images,\n"
-        u"to be printed\n"
-        u"Please press the button \n"
-        u"''Finish Order And Send''");
-    set(Command15, u"יציאה", u"EXIT");
-    set(Command4, u"סגור חלון זה", u"Close this window");
-
-    set(Frame4, u"סיום הבחירה", u"Your order");
-    set(Label19Prompt, u"גודל נייר", u"Paper size");
-    set(Label20Prompt, u"עותקים", u"Copies");
-    set(Label17, u"כתובת דואר אלקטרוני", u"E-mail address");
-    set(Label33, u"דואר אלקטרוני שדה חובה", u"E-mail is a required field");
-    set(Text2Prompt, u"הערות", u"Notes");
+    setWords({
+        {Frame3, u"יציאה", u"Leaving"},
+        {Label11,
+         u"בחרת תמונות למשלוח והנך מבקש לצאת\n"
+         u"אם ברצונך לצאת לחץ על יציאה\n"
+         u"אם ברצונך לשלוח את התמונות להדפסה\n"
+         u"לחץ על סיים ושלח",
+         u"You have chosen to leave this program,\n"
+         u"but you did select images.\n"
+         u"In case you want leave press EXIT.\n"
+         u"If you want to send the images,\n"
+         u"to be printed\n"
+         u"Please press the button \n"
+         u"''Finish Order And Send''"},
+        {Command15, u"יציאה", u"EXIT"},
+        {Command4, u"סגור חלון זה", u"Close this window"},
+        {Frame4, u"סיום הבחירה", u"Your order"},
+        {closingHead, u"כמעט סיימנו", u"Almost done"},
+        {Label19Prompt, u"גודל נייר", u"Paper size"},
+        {Label20Prompt, u"עותקים", u"Copies"},
+        {Label17, u"כתובת דואר אלקטרוני", u"E-mail address"},
+        {Label33, u"דואר אלקטרוני שדה חובה", u"E-mail is a required field"},
+        {Text2Prompt, u"הערות", u"Notes"},
+        {LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
+         u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box "},
+        {Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon"},
+        {Command8, u"המשך", u"Continue"},
+        {Command10, u"חזור לדף בחירת תמונות ", u"Back to the pictures"},
+        {Pic4snifim, u"בחר סניף שבו תרצה לקבל את התמונות", u"Choose the branch where you want to get the pictures"},
+        {Image33, u"בחר סניף", u"Choose a branch"},
+        {Command28, u"סגור", u"Close"},
+        {Picture7, u"דחיסת תמונות גדולות", u"Compression of large prints"},
+        {Label37, u"האם להעמיק את דחיסת התמונות? המשלוח יהיה מהיר יותר",
+         u"Compress the pictures more deeply? They will be sent faster"},
+        {Command20, u"לא להעמיק דחיסה", u"Do not compress deeper"},
+        {Command21, u"כן להעמיק דחיסה", u"Compress deeper"},
+    });
+    Combo1.spoken = m_state.wording(u"ספק הדואר, אחרי השטרודל", u"Mail provider, behind the at sign");
     if (m_promptStands)
         Combo1.text = mailDomainPrompt(m_state.english());
-    set(LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
-        u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box ");
-    set(Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon");
     Label4kpn3.text = QString::number(m_state.coupon.MisparKoopon);
     if (m_state.TachanaMekomit)
-        set(Command7, u"המשך", u"Continue");
+        setWords({{Command7, u"המשך", u"Continue"}});
     else
-        set(Command7, u"המשך ללא כתובת דואר", u"Continue without my address");
-    set(Command8, u"המשך", u"Continue");
-    set(Command10, u"חזור לדף בחירת תמונות ", u"Back to the pictures");
-
-    set(Pic4snifim, u"בחר סניף שבו תרצה לקבל את התמונות", u"Choose the branch where you want to get the pictures");
-    set(Image33, u"בחר סניף", u"Choose a branch");
-    set(Command28, u"סגור", u"Close");
-
-    set(Picture7, u"דחיסת תמונות גדולות", u"Compression of large prints");
-    set(Label37, u"האם להעמיק את דחיסת התמונות? המשלוח יהיה מהיר יותר",
-        u"Compress the pictures more deeply? They will be sent faster");
-    set(Command20, u"לא להעמיק דחיסה", u"Do not compress deeper");
-    set(Command21, u"כן להעמיק דחיסה", u"Compress deeper");
+        setWords({{Command7, u"המשך ללא כתובת דואר", u"Continue without my address"}});
 }
 
 void kyoskNew::showGuide(Guide guide) {
@@ -169,7 +175,8 @@ void kyoskNew::showGuide(Guide guide) {
         break;
     }
     Picture2.bitmap = Bitmap();
-    Picture2.warning = false;
+    Picture2.poor = false;
+    Image4.visible = false;
 }
 
 } // namespace lumora

@@ -16,12 +16,11 @@ LargePicture::LargePicture(const Theme& theme, QWidget* parent)
     setMinimumSize(theme.px(180), theme.px(120));
 }
 
-void LargePicture::show(const kyoskNew::LargeView& view, const QString& warning, const QString& meaning) {
+void LargePicture::show(const LargeView& view) {
     m_view = view;
-    m_warning = warning;
     setAccessibleName(view.bitmap.isNull() ? view.guide.join(u' ').simplified()
-                      : view.warning       ? meaning + u". "_s + warning
-                                           : meaning);
+                      : view.poor          ? view.spoken + u". "_s + view.warning
+                                           : view.spoken);
     setCursor(view.bitmap.isNull() ? Qt::ArrowCursor : Qt::PointingHandCursor);
     setFocusPolicy(view.bitmap.isNull() ? Qt::NoFocus : Qt::TabFocus);
     update();
@@ -85,7 +84,7 @@ void LargePicture::paintEvent(QPaintEvent*) {
     const int inset = m_theme.px(6);
     painter.drawPixmap(plate.topLeft() + QPointF(inset, inset),
                        m_theme.icon(u"look"_s, sign - 2 * inset, Theme::Colour::Ink));
-    if (!m_view.warning)
+    if (!m_view.poor)
         return;
     painter.setFont(m_theme.font(Theme::Type::Small));
     const int icon = m_theme.px(22);
@@ -99,7 +98,7 @@ void LargePicture::paintEvent(QPaintEvent*) {
     painter.setLayoutDirection(layoutDirection());
     const int beside = icon + m_theme.px(14);
     painter.drawText(room.adjusted(rightToLeft ? m_theme.px(6) : beside, 0, rightToLeft ? -beside : -m_theme.px(6), 0),
-                     Qt::AlignVCenter | Qt::AlignLeading | Qt::TextWordWrap, m_warning);
+                     Qt::AlignVCenter | Qt::AlignLeading | Qt::TextWordWrap, m_view.warning);
 }
 
 } // namespace lumora

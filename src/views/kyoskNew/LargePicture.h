@@ -1,6 +1,6 @@
 #pragma once
 
-#include "selection/pictures/kyoskNew.h"
+#include "selection/pictures/kyoskNewControls.h"
 #include "views/kit/Theme.h"
 
 #include <QWidget>
@@ -13,8 +13,7 @@ class LargePicture : public QWidget {
     Q_OBJECT
 public:
     LargePicture(const Theme& theme, QWidget* parent);
-    // meaning: what a press on the picture does, for who hears the page.
-    void show(const kyoskNew::LargeView& view, const QString& warning, const QString& meaning);
+    void show(const LargeView& view);
 
 Q_SIGNALS:
     void clicked();
@@ -27,8 +26,7 @@ protected:
 
 private:
     const Theme& m_theme;
-    kyoskNew::LargeView m_view;
-    QString m_warning;
+    LargeView m_view;
     bool m_pressed = false;
 };
 

@@ -51,7 +51,8 @@ void breakLong(QPushButton& button) {
 
 kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page) {
+    , m_page(page)
+    , m_shown(page.controls()) {
     frame().steps().setStep(OrderStep::Pictures);
     frame().setTitleVisible(false);
     frame().content()->setSpacing(theme.px(8));
@@ -77,7 +78,7 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     makeBranchPanel();
     makeCompressionPanel();
     bindTheRest();
-    m_focusRequest = page.focusRequest;
+    m_focusRequest = page.focusRequest();
     start();
 }
 
@@ -86,16 +87,16 @@ QLayout* kyoskNewView::makeTopRow() {
     row->setSpacing(theme().px(10));
     auto* words = new QVBoxLayout;
     words->setSpacing(0);
-    words->addWidget(label(u"Title"_s, m_page.Title, "large"));
+    words->addWidget(label(u"Title"_s, m_shown.Title, "large"));
     m_folder = makeLabel(this, "smallMuted");
     m_folder->setWordWrap(false);
-    bind(u"Label29"_s, m_folder, [this] { return m_page.Label29.text; });
+    bind(u"Label29"_s, m_folder, [this] { return m_shown.Label29.text; });
     words->addWidget(m_folder);
     row->addLayout(words, 1);
     row->addWidget(button(
-        u"Command14"_s, m_page.Command14, Role::Plain, [this] { m_page.Command14_Click(); }, u"check-circle"_s));
-    m_previous = button(u"Image15"_s, m_page.Image15, Role::Plain, [this] { m_page.Image15_Click(); });
-    m_next = button(u"Image16"_s, m_page.Image16, Role::Plain, [this] { m_page.Image16_Click(); });
+        u"Command14"_s, m_shown.Command14, Role::Plain, [this] { m_page.Command14_Click(); }, u"check-circle"_s));
+    m_previous = button(u"Image15"_s, m_shown.Image15, Role::Plain, [this] { m_page.Image15_Click(); });
+    m_next = button(u"Image16"_s, m_shown.Image16, Role::Plain, [this] { m_page.Image16_Click(); });
     row->addWidget(m_previous);
     row->addWidget(m_next);
     return row;
@@ -106,7 +107,7 @@ QWidget* kyoskNewView::makeGrid() {
     auto* grid = new QGridLayout(box);
     grid->setContentsMargins(0, 0, 0, 0);
     grid->setSpacing(theme().px(10));
-    bind(u"Frame1"_s, box, [this] { return m_page.Frame1.text; });
+    bind(u"Frame1"_s, box, [this] { return m_shown.Frame1.text; });
     for (int i = 0; i < static_cast<int>(cellsOfPage); ++i) {
         const auto at = static_cast<std::size_t>(i);
         auto* cell = new PictureCell(theme(), box);
@@ -125,12 +126,12 @@ QWidget* kyoskNewView::makeGrid() {
             m_cells[static_cast<std::size_t>(next)]->setFocus(Qt::TabFocusReason);
         });
         const auto numbered = [i](const char* name) { return u"%1(%2)"_s.arg(QLatin1StringView(name)).arg(i); };
-        bind(numbered("Picture1"), cell, [this, at] { return m_page.List2.item(static_cast<int>(at)); });
-        bind(numbered("Picture4"), cell->mark(), [this, at] { return m_page.Picture4[at].text; });
-        bind(numbered("Label4"), cell->copies(), [this, at] { return m_page.Label4[at].text; });
-        bind(numbered("Command12"), cell->plus(), [this, at] { return m_page.Command12[at].text; });
-        bind(numbered("Command13"), cell->minus(), [this, at] { return m_page.Command13[at].text; });
-        bindHidden(numbered("Label5"), m_page.Label5[at]);
+        bind(numbered("Picture1"), cell, [this, at] { return m_shown.List2.item(static_cast<int>(at)); });
+        bind(numbered("Picture4"), cell->mark(), [this, at] { return m_shown.Picture4[at].text; });
+        bind(numbered("Label4"), cell->copies(), [this, at] { return m_shown.Label4[at].text; });
+        bind(numbered("Command12"), cell->plus(), [this, at] { return m_shown.Command12[at].text; });
+        bind(numbered("Command13"), cell->minus(), [this, at] { return m_shown.Command13[at].text; });
+        bindHidden(numbered("Label5"), m_shown.Label5[at]);
         grid->addWidget(cell, i / columns, i % columns);
     }
     for (int i = 0; i < columns; ++i)
@@ -148,19 +149,12 @@ QWidget* kyoskNewView::makeEmpty() {
     sign->setPixmap(theme().icon(u"pictures"_s, theme().px(96), Theme::Colour::Primary));
     sign->setAlignment(Qt::AlignCenter);
     column->addWidget(sign);
-    m_emptyHead = makeLabel(box, "title");
-    m_emptyHead->setAlignment(Qt::AlignCenter);
-    column->addWidget(m_emptyHead);
-    m_emptyText = makeLabel(box, "body");
-    m_emptyText->setAlignment(Qt::AlignCenter);
-    bind(u"Label25"_s, m_emptyText, [this] { return m_page.Label25.text; });
-    column->addWidget(m_emptyText);
-    m_firstFolder = new QPushButton(box);
-    setRole(m_firstFolder, "main");
-    m_firstFolder->setObjectName(u"firstFolder"_s);
-    m_firstFolder->setFocusPolicy(Qt::TabFocus);
-    setIcon(m_firstFolder, u"folder-plus"_s, Qt::white);
-    connect(m_firstFolder, &QPushButton::clicked, this, [this] { m_page.Image5_Click(); });
+    for (QLabel* words : {label(u"emptyHead"_s, m_shown.emptyHead, "title"), label(u"Label25"_s, m_shown.Label25)}) {
+        words->setAlignment(Qt::AlignCenter);
+        column->addWidget(words);
+    }
+    m_firstFolder = button(
+        u"firstFolder"_s, m_shown.firstFolder, Role::Main, [this] { m_page.Image5_Click(); }, u"folder-plus"_s);
     column->addWidget(m_firstFolder, 0, Qt::AlignCenter);
     column->addStretch(1);
     return box;
@@ -177,80 +171,81 @@ QWidget* kyoskNewView::makeSide() {
     inside->setContentsMargins(theme().px(14), theme().px(14), theme().px(14), theme().px(10));
     inside->setSpacing(theme().px(6));
     m_large = new LargePicture(theme(), card);
-    bind(u"Picture2"_s, m_large, [this] { return m_page.Picture2.guide.join(u'\n'); });
+    bind(u"Picture2"_s, m_large, [this] { return m_shown.Picture2.guide.join(u'\n'); });
     connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
     inside->addWidget(m_large, 1);
-    auto* grade = label(u"Label6"_s, m_page.Label6, "strong");
+    auto* grade = label(u"Label6"_s, m_shown.Label6, "strong");
     grade->setAlignment(Qt::AlignCenter);
     inside->addWidget(grade);
-    m_turn = button(
-        u"Image4"_s, m_page.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"rotate"_s);
-    inside->addWidget(m_turn, 0, Qt::AlignCenter);
+    inside->addWidget(button(
+                          u"Image4"_s, m_shown.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"rotate"_s),
+                      0, Qt::AlignCenter);
     column->addWidget(card, 1);
 
-    m_offer = new QFrame(box);
-    setRole(m_offer, "notice");
-    auto* offer = new QVBoxLayout(m_offer);
+    auto* offerCard = new QFrame(box);
+    setRole(offerCard, "notice");
+    auto* offer = new QVBoxLayout(offerCard);
     offer->setContentsMargins(theme().px(14), theme().px(10), theme().px(14), theme().px(12));
     offer->setSpacing(theme().px(6));
-    auto* offerText = label(u"Label35"_s, m_page.Label35, "strong");
+    auto* offerText = label(u"Label35"_s, m_shown.Label35, "strong");
     offerText->setAlignment(Qt::AlignCenter);
     offer->addWidget(offerText);
-    offer->addWidget(button(u"Command24"_s, m_page.Command24, Role::Plain, [this] { m_page.Command24_Click(); }));
-    offer->addWidget(button(u"Command25"_s, m_page.Command25, Role::Plain, [this] { m_page.Command25_Click(); }));
-    offer->addWidget(button(u"Command23"_s, m_page.Command23, Role::Quiet, [this] { m_page.Command23_Click(); }));
-    for (const char* name : {"Command24", "Command25", "Command23"})
-        setRole(m_offer->findChild<QWidget*>(QString::fromLatin1(name)), "tall");
-    bind(u"Picture66"_s, m_offer, m_page.Picture66);
-    column->addWidget(m_offer);
+    m_offerButtons = {
+        button(u"Command24"_s, m_shown.Command24, Role::Plain, [this] { m_page.Command24_Click(); }),
+        button(u"Command25"_s, m_shown.Command25, Role::Plain, [this] { m_page.Command25_Click(); }),
+        button(u"Command23"_s, m_shown.Command23, Role::Quiet, [this] { m_page.Command23_Click(); }),
+    };
+    for (QPushButton* answer : m_offerButtons) {
+        setRole(answer, "tall");
+        offer->addWidget(answer);
+    }
+    bind(u"Picture66"_s, offerCard, m_shown.Picture66);
+    column->addWidget(offerCard);
     column->addWidget(button(
-        u"Image33"_s, m_page.Image33, Role::Plain, [this] { m_page.Image33_Click(); }, u"shop"_s));
+        u"Image33"_s, m_shown.Image33, Role::Plain, [this] { m_page.Image33_Click(); }, u"shop"_s));
     return box;
 }
 
 void kyoskNewView::makeBars() {
     frame().addHeaderAction(button(
-        u"Image11"_s, m_page.Image11, Role::Quiet, [this] { m_page.Image11_Click(); }, u"tag"_s));
+        u"Image11"_s, m_shown.Image11, Role::Quiet, [this] { m_page.Image11_Click(); }, u"tag"_s));
     frame().addHeaderAction(button(
-        u"Image6"_s, m_page.Image6, Role::Quiet, [this] { m_page.Image6_Click(); }, u"info"_s));
+        u"Image6"_s, m_shown.Image6, Role::Quiet, [this] { m_page.Image6_Click(); }, u"info"_s));
     frame().addHeaderAction(button(
-        u"Image10"_s, m_page.Image10, Role::Quiet, [this] { m_page.Image10_Click(); }, u"exit"_s));
+        u"Image10"_s, m_shown.Image10, Role::Quiet, [this] { m_page.Image10_Click(); }, u"exit"_s));
     frame().addSecondaryAction(button(
-        u"Image5"_s, m_page.Image5, Role::Secondary, [this] { m_page.Image5_Click(); }, u"folder-plus"_s));
+        u"Image5"_s, m_shown.Image5, Role::Secondary, [this] { m_page.Image5_Click(); }, u"folder-plus"_s));
     frame().addSecondaryAction(button(
-        u"Image8"_s, m_page.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"eraser"_s));
+        u"Image8"_s, m_shown.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"eraser"_s));
 
-    m_total = new QFrame(this);
-    auto* total = new QHBoxLayout(m_total);
-    total->setContentsMargins(0, 0, 0, 0);
-    total->setSpacing(theme().px(10));
-    m_totalWord = label(u"Label7Prompt"_s, m_page.Label7Prompt, "body");
-    m_totalWord->setWordWrap(false);
-    total->addWidget(m_totalWord);
-    m_totalNumber = label(u"Label7"_s, m_page.Label7, "title");
-    m_totalNumber->setWordWrap(false);
-    total->addWidget(m_totalNumber);
-    total->addSpacing(theme().px(14));
-    auto* paper = label(u"Label15"_s, m_page.Label15, "muted");
-    paper->setWordWrap(false);
-    total->addWidget(paper);
-    frame().addStatus(m_total);
+    auto* total = new QFrame(this);
+    auto* row = new QHBoxLayout(total);
+    row->setContentsMargins(0, 0, 0, 0);
+    row->setSpacing(theme().px(10));
+    const auto word = [&](const QString& name, const Caption& caption, const char* type) {
+        auto* made = label(name, caption, type);
+        made->setWordWrap(false);
+        row->addWidget(made);
+    };
+    word(u"Label7Prompt"_s, m_shown.Label7Prompt, "body");
+    word(u"Label7"_s, m_shown.Label7, "title");
+    row->addSpacing(theme().px(14));
+    word(u"Label15"_s, m_shown.Label15, "muted");
+    frame().addStatus(total);
 
-    m_finish = button(u"Image7"_s, m_page.Image7, Role::Main, [this] { m_page.Image7_Click(); });
-    m_finishAlbum = button(u"Image13"_s, m_page.Image13, Role::Main, [this] { m_page.Image13_Click(); });
-    frame().addMainAction(m_finishAlbum);
-    frame().addMainAction(m_finish);
+    frame().addMainAction(button(u"Image13"_s, m_shown.Image13, Role::Main, [this] { m_page.Image13_Click(); }));
+    frame().addMainAction(button(u"Image7"_s, m_shown.Image7, Role::Main, [this] { m_page.Image7_Click(); }));
 }
 
 void kyoskNewView::makeLeavePanel() {
     m_leave = new Overlay(theme(), this);
-    m_leave->column()->addWidget(label(u"Label11"_s, m_page.Label11, "large"));
+    m_leave->column()->addWidget(label(u"Label11"_s, m_shown.Label11, "large"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
     row->addWidget(button(
-        u"Command15"_s, m_page.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"exit"_s));
+        u"Command15"_s, m_shown.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"exit"_s));
     row->addStretch(1);
-    auto* stay = button(u"Command4"_s, m_page.Command4, Role::Main, [this] { m_page.Command4_Click(); });
+    auto* stay = button(u"Command4"_s, m_shown.Command4, Role::Main, [this] { m_page.Command4_Click(); });
     row->addWidget(stay);
     m_leave->column()->addLayout(row);
     m_leave->setFirstFocus(stay);
@@ -260,14 +255,10 @@ void kyoskNewView::makeLeavePanel() {
 void kyoskNewView::makeHelpPanel() {
     m_help = new Overlay(theme(), this);
     m_help->setCardWidth(700);
-    m_help->column()->addWidget(label(u"Label9"_s, m_page.Label9));
-    m_helpClose = new QPushButton(m_help);
-    setRole(m_helpClose, "main");
-    m_helpClose->setObjectName(u"helpClose"_s);
-    m_helpClose->setFocusPolicy(Qt::TabFocus);
-    connect(m_helpClose, &QPushButton::clicked, this, [this] { m_page.Image6_Click(); });
-    m_help->column()->addWidget(m_helpClose, 0, Qt::AlignTrailing);
-    m_help->setFirstFocus(m_helpClose);
+    m_help->column()->addWidget(label(u"Label9"_s, m_shown.Label9));
+    auto* close = button(u"helpClose"_s, m_shown.helpClose, Role::Main, [this] { m_page.Image6_Click(); });
+    m_help->column()->addWidget(close, 0, Qt::AlignTrailing);
+    m_help->setFirstFocus(close);
     connect(m_help, &Overlay::escaped, this, [this] { m_page.Image6_Click(); });
 }
 
@@ -278,10 +269,9 @@ void kyoskNewView::makeClosingPanel() {
     column->setSpacing(theme().px(8));
     auto* top = new QHBoxLayout;
     top->setSpacing(theme().px(12));
-    m_closingHead = makeLabel(m_closing, "title");
-    top->addWidget(m_closingHead, 1);
+    top->addWidget(label(u"closingHead"_s, m_shown.closingHead, "title"), 1);
     top->addWidget(button(
-        u"Image17"_s, m_page.Image17, Role::Quiet, [this] { m_page.Image17_Click(); }, u"tag"_s));
+        u"Image17"_s, m_shown.Image17, Role::Quiet, [this] { m_page.Image17_Click(); }, u"tag"_s));
     column->addLayout(top);
 
     auto* facts = new QFrame(m_closing);
@@ -297,13 +287,13 @@ void kyoskNewView::makeClosingPanel() {
         factRow->addWidget(valueLabel);
         factRow->addStretch(1);
     };
-    fact(u"Label20Prompt"_s, m_page.Label20Prompt, u"Label20"_s, m_page.Label20);
-    fact(u"Label19Prompt"_s, m_page.Label19Prompt, u"Label19"_s, m_page.Label19);
+    fact(u"Label20Prompt"_s, m_shown.Label20Prompt, u"Label20"_s, m_shown.Label20);
+    fact(u"Label19Prompt"_s, m_shown.Label19Prompt, u"Label19"_s, m_shown.Label19);
     column->addWidget(facts);
     auto* coupon = new QHBoxLayout;
     coupon->setSpacing(theme().px(8));
-    for (QLabel* part : {label(u"Label4kpn3Prompt"_s, m_page.Label4kpn3Prompt, "muted"),
-                         label(u"Label4kpn3"_s, m_page.Label4kpn3, "strong")}) {
+    for (QLabel* part : {label(u"Label4kpn3Prompt"_s, m_shown.Label4kpn3Prompt, "muted"),
+                         label(u"Label4kpn3"_s, m_shown.Label4kpn3, "strong")}) {
         part->setWordWrap(false);
         coupon->addWidget(part);
     }
@@ -311,8 +301,8 @@ void kyoskNewView::makeClosingPanel() {
     column->addLayout(coupon);
 
     auto* mailLine = new QHBoxLayout;
-    mailLine->addWidget(label(u"Label17"_s, m_page.Label17, "strong"));
-    auto* required = label(u"Label33"_s, m_page.Label33, "danger");
+    mailLine->addWidget(label(u"Label17"_s, m_shown.Label17, "strong"));
+    auto* required = label(u"Label33"_s, m_shown.Label33, "danger");
     required->setWordWrap(false);
     mailLine->addWidget(required);
     mailLine->addStretch(1);
@@ -323,7 +313,7 @@ void kyoskNewView::makeClosingPanel() {
     auto* addressRow = new QHBoxLayout(address);
     addressRow->setContentsMargins(0, 0, 0, 0);
     addressRow->setSpacing(theme().px(8));
-    m_mail = field(u"Text1"_s, m_page.Text1, [this](const QString& text) { m_page.Text1_Change(text); });
+    m_mail = field(u"Text1"_s, m_shown.Text1, [this](const QString& text) { m_page.Text1_Change(text); });
     m_mail->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     addressRow->addWidget(m_mail, 3);
     m_at = makeLabel(address, "large");
@@ -332,28 +322,27 @@ void kyoskNewView::makeClosingPanel() {
     m_domain = new EditableCombo(
         address, [this](int row) { m_page.Combo1_Click(row); },
         [this](const QString& text) { m_page.Combo1_Change(text); });
-    bind(u"Combo1"_s, m_domain, m_page.Combo1);
+    bind(u"Combo1"_s, m_domain, m_shown.Combo1);
     addressRow->addWidget(m_domain, 2);
-    m_albumMail = field(u"Txt4Ml2"_s, m_page.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
+    m_albumMail = field(u"Txt4Ml2"_s, m_shown.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
     addressRow->addWidget(m_albumMail, 5);
     column->addWidget(address);
 
     column->addSpacing(theme().px(6));
-    column->addWidget(label(u"Text2Prompt"_s, m_page.Text2Prompt, "strong"));
-    m_note = field(u"Text2"_s, m_page.Text2, [this](const QString& text) { m_page.Text2_Change(text); });
+    column->addWidget(label(u"Text2Prompt"_s, m_shown.Text2Prompt, "strong"));
+    m_note = field(u"Text2"_s, m_shown.Text2, [this](const QString& text) { m_page.Text2_Change(text); });
     column->addWidget(m_note);
-    column->addWidget(label(u"LblKoopon"_s, m_page.LblKoopon, "smallMuted"));
+    column->addWidget(label(u"LblKoopon"_s, m_shown.LblKoopon, "smallMuted"));
     column->addSpacing(theme().px(6));
 
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
-    m_backToPictures = button(u"Command10"_s, m_page.Command10, Role::Secondary, [this] { m_page.Command10_Click(); });
+    m_backToPictures = button(u"Command10"_s, m_shown.Command10, Role::Secondary, [this] { m_page.Command10_Click(); });
     row->addWidget(m_backToPictures);
     row->addStretch(1);
-    m_withoutAddress = button(u"Command7"_s, m_page.Command7, Role::Secondary, [this] { m_page.Command7_Click(); });
+    m_withoutAddress = button(u"Command7"_s, m_shown.Command7, Role::Secondary, [this] { m_page.Command7_Click(); });
     row->addWidget(m_withoutAddress);
-    m_withAddress = button(u"Command8"_s, m_page.Command8, Role::Main, [this] { m_page.Command8_Click(); });
-    row->addWidget(m_withAddress);
+    row->addWidget(button(u"Command8"_s, m_shown.Command8, Role::Main, [this] { m_page.Command8_Click(); }));
     column->addLayout(row);
     m_closing->setFirstFocus(m_mail);
     connect(m_closing, &Overlay::escaped, this, [this] { m_page.Command10_Click(); });
@@ -362,8 +351,7 @@ void kyoskNewView::makeClosingPanel() {
 void kyoskNewView::makeBranchPanel() {
     m_branches = new Overlay(theme(), this);
     m_branches->setCardWidth(820);
-    m_branchHead = label(u"Pic4snifim"_s, m_page.Pic4snifim, "title");
-    m_branches->column()->addWidget(m_branchHead);
+    m_branches->column()->addWidget(label(u"Pic4snifim"_s, m_shown.Pic4snifim, "title"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().px(20));
     auto* grid = new QGridLayout;
@@ -371,7 +359,7 @@ void kyoskNewView::makeBranchPanel() {
     for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
         const int branch = static_cast<int>(i);
         auto* made = button(
-            u"Command4Snif(%1)"_s.arg(i), m_page.Command4Snif[i], Role::Plain,
+            u"Command4Snif(%1)"_s.arg(i), m_shown.Command4Snif[i], Role::Plain,
             [this, branch] { m_page.Command4Snif_Click(branch); }, branch == 10 ? u"truck"_s : u"shop"_s);
         m_branchButtons[i] = made;
         grid->addWidget(made, branch / 2, branch % 2);
@@ -380,13 +368,13 @@ void kyoskNewView::makeBranchPanel() {
     auto* card = new QFrame(m_branches);
     setRole(card, "notice");
     auto* cardColumn = new QVBoxLayout(card);
-    cardColumn->addWidget(label(u"Label41"_s, m_page.Label41));
+    cardColumn->addWidget(label(u"Label41"_s, m_shown.Label41));
     cardColumn->addStretch(1);
-    bind(u"Pic4Snif"_s, card, m_page.Pic4Snif);
+    bind(u"Pic4Snif"_s, card, m_shown.Pic4Snif);
     row->addWidget(card, 2);
     m_branches->column()->addLayout(row);
     m_branches->column()->addWidget(
-        button(u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
+        button(u"Command28"_s, m_shown.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
         Qt::AlignLeading);
     connect(m_branches, &Overlay::escaped, this, [this] { m_page.Command28_Click(); });
     // The card beside the buttons follows the mouse and the keyboard alike.
@@ -412,46 +400,46 @@ bool kyoskNewView::eventFilter(QObject* watched, QEvent* event) {
 
 void kyoskNewView::makeCompressionPanel() {
     m_compression = new Overlay(theme(), this);
-    m_compression->column()->addWidget(label(u"Label37"_s, m_page.Label37, "large"));
+    m_compression->column()->addWidget(label(u"Label37"_s, m_shown.Label37, "large"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
-    row->addWidget(button(u"Command20"_s, m_page.Command20, Role::Secondary, [this] { m_page.Command20_Click(); }));
+    row->addWidget(button(u"Command20"_s, m_shown.Command20, Role::Secondary, [this] { m_page.Command20_Click(); }));
     row->addStretch(1);
-    auto* yes = button(u"Command21"_s, m_page.Command21, Role::Main, [this] { m_page.Command21_Click(); });
+    auto* yes = button(u"Command21"_s, m_shown.Command21, Role::Main, [this] { m_page.Command21_Click(); });
     row->addWidget(yes);
     m_compression->column()->addLayout(row);
     m_compression->setFirstFocus(yes);
 }
 
 void kyoskNewView::bindTheRest() {
-    const std::pair<const char*, const Caption*> captions[] = {{"Label1", &m_page.Label1},
-                                                               {"Label2", &m_page.Label2},
-                                                               {"Label18", &m_page.Label18},
-                                                               {"Label24", &m_page.Label24},
-                                                               {"Label34", &m_page.Label34},
-                                                               {"Label34Prompt", &m_page.Label34Prompt},
-                                                               {"Label36", &m_page.Label36},
-                                                               {"Frame2", &m_page.Frame2},
-                                                               {"Frame3", &m_page.Frame3},
-                                                               {"Frame4", &m_page.Frame4},
-                                                               {"Picture7", &m_page.Picture7},
-                                                               {"PicB4Sioom", &m_page.PicB4Sioom},
-                                                               {"Pic4Brose", &m_page.Pic4Brose},
-                                                               {"Command11", &m_page.Command11},
-                                                               {"Image19", &m_page.Image19},
-                                                               {"Image20", &m_page.Image20},
-                                                               {"Image23", &m_page.Image23},
-                                                               {"Command26(0)", &m_page.Command26[0]},
-                                                               {"Command26(1)", &m_page.Command26[1]}};
+    const std::pair<const char*, const Caption*> captions[] = {{"Label1", &m_shown.Label1},
+                                                               {"Label2", &m_shown.Label2},
+                                                               {"Label18", &m_shown.Label18},
+                                                               {"Label24", &m_shown.Label24},
+                                                               {"Label34", &m_shown.Label34},
+                                                               {"Label34Prompt", &m_shown.Label34Prompt},
+                                                               {"Label36", &m_shown.Label36},
+                                                               {"Frame2", &m_shown.Frame2},
+                                                               {"Frame3", &m_shown.Frame3},
+                                                               {"Frame4", &m_shown.Frame4},
+                                                               {"Picture7", &m_shown.Picture7},
+                                                               {"PicB4Sioom", &m_shown.PicB4Sioom},
+                                                               {"Pic4Brose", &m_shown.Pic4Brose},
+                                                               {"Command11", &m_shown.Command11},
+                                                               {"Image19", &m_shown.Image19},
+                                                               {"Image20", &m_shown.Image20},
+                                                               {"Image23", &m_shown.Image23},
+                                                               {"Command26(0)", &m_shown.Command26[0]},
+                                                               {"Command26(1)", &m_shown.Command26[1]}};
     for (const auto& [name, caption] : captions)
         bindHidden(QString::fromLatin1(name), *caption);
-    bindList(u"List1"_s, m_page.List1.lines());
-    bindList(u"List2"_s, m_page.List2);
-    bindList(u"List4"_s, m_page.List4.paths());
+    bindList(u"List1"_s, m_shown.List1);
+    bindList(u"List2"_s, m_shown.List2);
+    bindList(u"List4"_s, m_shown.List4);
 }
 
 QWidget* kyoskNewView::firstFocus() const {
-    return m_page.List4.isEmpty() ? static_cast<QWidget*>(m_firstFolder) : m_cells[0];
+    return m_page.showsCells() ? static_cast<QWidget*>(m_cells[0]) : m_firstFolder;
 }
 
 void kyoskNewView::escape() {
@@ -478,94 +466,77 @@ void kyoskNewView::fitCells() {
 
 void kyoskNewView::renderCells() {
     for (std::size_t i = 0; i < cellsOfPage; ++i) {
-        const QString path = m_page.List2.item(static_cast<int>(i));
+        const CellPicture& cell = m_shown.Picture1[i];
         PictureCell::Look look;
-        look.filled = !path.isEmpty();
-        look.picture = m_page.Picture1[i].visible ? m_page.Picture1[i].bitmap.image() : QImage();
-        look.chosen = look.filled && m_page.Picture4[i].visible;
-        look.inEditor = m_page.Command13[i].colour == kyoskNew::KeyColour::Orange;
-        look.copies = m_page.Label4[i].text;
-        look.name = LeafName(path);
+        look.filled = !cell.text.isEmpty();
+        look.picture = cell.visible ? cell.bitmap.image() : QImage();
+        look.chosen = m_shown.Picture4[i].visible;
+        look.inEditor = m_page.openCell() == static_cast<int>(i);
+        look.copies = m_shown.Label4[i].text;
+        look.name = LeafName(cell.text);
         m_cells[i]->show(look);
-        speak(
-            m_cells[i],
-            !look.filled ? wording(u"תא ריק"_s, u"Empty place"_s)
-            : look.chosen
-                ? wording(u"%1, נבחרה, עותקים: %2"_s, u"%1, chosen, copies: %2"_s).arg(look.name, look.copies.trimmed())
-            : m_page.plain() ? wording(u"%1, לחץ לבחירה"_s, u"%1, press to choose"_s).arg(look.name)
-                             : wording(u"%1, לחץ לעריכה"_s, u"%1, press to edit"_s).arg(look.name));
-        speak(m_cells[i]->plus(), wording(u"עותק נוסף של %1"_s, u"One more copy of %1"_s).arg(look.name));
-        speak(m_cells[i]->minus(), wording(u"עותק אחד פחות של %1"_s, u"One copy less of %1"_s).arg(look.name));
+        speak(m_cells[i], cell.spoken);
+        speak(m_cells[i]->plus(), m_shown.Command12[i].spoken);
+        speak(m_cells[i]->minus(), m_shown.Command13[i].spoken);
     }
 }
 
 void kyoskNewView::renderClosing() {
-    m_closingHead->setText(wording(u"כמעט סיימנו"_s, u"Almost done"_s));
-    speak(m_mail, m_page.Label17.text.simplified());
-    speak(m_domain, wording(u"ספק הדואר, אחרי השטרודל"_s, u"Mail provider, behind the at sign"_s));
-    speak(m_albumMail, m_page.Label17.text.simplified());
-    speak(m_note, m_page.Text2Prompt.text.simplified());
-    m_domain->display(m_page.Combo1Items, m_page.Combo1Index, m_page.Combo1.text);
-    m_at->setVisible(m_page.Text1.visible);
-    const bool local = !m_page.Command8.visible && m_page.Command7.visible;
-    changeRole(m_withoutAddress, local ? "main" : "secondary");
-    m_closing->setFirstFocus(m_page.Text1.visible ? m_mail : m_page.Txt4Ml2.visible ? m_albumMail : m_note);
-    m_closing->setOpen(m_page.Frame4.visible);
+    speak(m_mail, m_shown.Label17.text.simplified());
+    speak(m_domain, m_shown.Combo1.spoken);
+    speak(m_albumMail, m_shown.Label17.text.simplified());
+    speak(m_note, m_shown.Text2Prompt.text.simplified());
+    m_domain->display(m_shown.Combo1Items, m_shown.Combo1Index, m_shown.Combo1.text);
+    const AddressBox box = m_page.addressBox();
+    m_at->setVisible(box == AddressBox::Mail);
+    changeRole(m_withoutAddress, box == AddressBox::None ? "main" : "secondary");
+    m_closing->setFirstFocus(box == AddressBox::Mail ? m_mail : box == AddressBox::AlbumMail ? m_albumMail : m_note);
+    m_closing->setOpen(m_shown.Frame4.visible);
 }
 
 void kyoskNewView::takeFocus() {
-    if (m_focusRequest == m_page.focusRequest)
+    if (m_focusRequest == m_page.focusRequest())
         return;
-    m_focusRequest = m_page.focusRequest;
-    if (auto* widget = findChild<QWidget*>(m_page.focusBox))
+    m_focusRequest = m_page.focusRequest();
+    if (auto* widget = findChild<QWidget*>(m_page.focusBox()))
         giveFocus(*widget);
+}
+
+void kyoskNewView::renderFolder() {
+    const QString folder = m_shown.Label29.text.trimmed();
+    QString line;
+    if (!folder.isEmpty())
+        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200))) + u"  ·  "_s +
+               m_shown.pictureCount.text;
+    m_folder->setText(line);
 }
 
 void kyoskNewView::render() {
     m_side->setLayoutDirection(layoutDirection());
-    const int body = m_page.List4.isEmpty() && m_page.List1.isEmpty() ? 0 : 1;
+    const int body = m_page.showsCells() ? 1 : 0;
     if (m_body->currentIndex() != body) {
         m_body->setCurrentIndex(body);
         QTimer::singleShot(0, this, &kyoskNewView::fitCells);
     }
-    m_emptyHead->setText(wording(u"מאיפה ניקח את התמונות?"_s, u"Where are your pictures?"_s));
-    m_emptyText->setText(isolated(m_page.Label25.text));
-    m_firstFolder->setText(wording(u"פתח תיקיית תמונות"_s, u"Open a folder of pictures"_s));
-    m_firstFolder->setAccessibleName(m_firstFolder->text());
-    const QString folder = m_page.Label29.text.trimmed();
-    QString line;
-    if (!folder.isEmpty())
-        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200)));
-    if (!m_page.Label34.text.trimmed().isEmpty() && !folder.isEmpty())
-        line += u"  ·  "_s + wording(u"%1 תמונות"_s, u"%1 pictures"_s).arg(m_page.Label34.text.trimmed());
-    m_folder->setText(line);
+    renderFolder();
     renderCells();
-    m_large->show(m_page.Picture2,
-                  wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת"_s, u"Few pixels: the print may come out blurred"_s),
-                  wording(u"הצגת התמונה בגדול"_s, u"Look at the picture in large"_s));
-    m_turn->setVisible(m_page.Image4.visible && !m_page.Picture2.bitmap.isNull());
+    m_large->show(m_shown.Picture2);
     setDirectedIcon(m_previous, Way::Back);
     setDirectedIcon(m_next, Way::Forwards);
     m_next->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight);
     setDirectedIcon(m_backToPictures, Way::Back);
-    // One main action at a time.
-    m_finishAlbum->setVisible(m_page.Image13.visible && !m_page.Image7.visible);
-    for (const char* name : {"Command24", "Command25", "Command23"})
-        breakLong(*findChild<QPushButton*>(QString::fromLatin1(name)));
-    m_helpClose->setText(wording(u"סגור"_s, u"Close"_s));
-    m_helpClose->setAccessibleName(m_helpClose->text());
-    m_leave->setOpen(m_page.Frame3.visible);
-    m_help->setOpen(m_page.Frame2.visible);
+    for (QPushButton* answer : m_offerButtons)
+        breakLong(*answer);
+    m_leave->setOpen(m_shown.Frame3.visible);
+    m_help->setOpen(m_shown.Frame2.visible);
     renderClosing();
-    // A lab with fewer shops leaves captions empty; the panel opens on the first branch there is.
-    for (auto at = m_branchButtons.rbegin(); at != m_branchButtons.rend(); ++at) {
-        if ((*at)->text().isEmpty())
-            (*at)->hide();
-        else
-            m_branches->setFirstFocus(*at);
+    // The panel opens on the first branch there is.
+    for (std::size_t i = m_branchButtons.size(); i-- > 0;) {
+        if (m_shown.Command4Snif[i].visible)
+            m_branches->setFirstFocus(m_branchButtons[i]);
     }
-    m_branches->setOpen(m_page.Pic4snifim.visible);
-    m_compression->setOpen(m_page.Picture7.visible);
+    m_branches->setOpen(m_shown.Pic4snifim.visible);
+    m_compression->setOpen(m_shown.Picture7.visible);
     takeFocus();
 }
 

@@ -282,7 +282,8 @@ QWidget* tFrmNewView::makeStrip() {
             if (m_pictures)
                 m_pictures->Picture1_Click(i);
         });
-        bind(u"Strip(%1)"_s.arg(i), cell, [this, i] { return m_pictures ? m_pictures->List2.item(i) : QString(); });
+        bind(u"Strip(%1)"_s.arg(i), cell,
+             [this, i] { return m_pictures ? m_pictures->controls().List2.item(i) : QString(); });
         row->addWidget(cell, 1);
     }
     return box;
@@ -350,11 +351,12 @@ void tFrmNewView::renderStrip() {
         StripCell::Look look;
         QString name;
         if (m_pictures) {
-            name = m_pictures->List2.item(static_cast<int>(i));
+            const CellPicture& cell = m_pictures->controls().Picture1[i];
+            name = cell.text;
             look.filled = !name.isEmpty();
-            look.picture = m_pictures->Picture1[i].visible ? m_pictures->Picture1[i].bitmap.image() : QImage();
-            look.ordered = look.filled && m_pictures->Picture4[i].visible;
-            look.open = m_pictures->Command13[i].colour == kyoskNew::KeyColour::Orange;
+            look.picture = cell.visible ? cell.bitmap.image() : QImage();
+            look.ordered = m_pictures->controls().Picture4[i].visible;
+            look.open = m_pictures->openCell() == static_cast<int>(i);
         }
         m_cells[i]->show(look);
         name = name.section(u'\\', -1);

@@ -1,0 +1,67 @@
+#pragma once
+
+#include "selection/Basket.h"
+#include "selection/FolderPager.h"
+
+#include <array>
+#include <optional>
+
+namespace lumora {
+
+// What the customer chooses from and what is chosen: the folders picked so far, the twelve cells of the page in view
+// with the copies of each, and the basket. The paper, the size and the border of a line are those that the order has
+// when the line is written.
+class PictureChoice {
+public:
+    explicit PictureChoice(const OrderDetails& order)
+        : m_order(order) {}
+    // Once, before any picture is chosen.
+    void setForm(LineForm form) { m_basket.setForm(form); }
+
+    const Basket& basket() const { return m_basket; }
+    const FolderPager& folders() const { return m_folders; }
+    // The paths of the page in view, one a cell.
+    const TextList& page() const { return m_page; }
+    // Empty for a cell without a picture.
+    QString path(int cell) const { return m_page.item(cell); }
+    // What the cell shows, 0 to 99: of two cells with the same picture each has its own number.
+    int copies(int cell) const { return m_copies.at(static_cast<std::size_t>(cell)); }
+    bool chosen(int cell) const { return copies(cell) > 0; }
+    bool inBasket(const QString& path) const { return m_basket.FindByPath(path) >= 0; }
+    // The edit record of a chosen picture in an order of the full form.
+    std::optional<QString> recordOf(const QString& path) const;
+
+    int addFolder(const QString& folder, const QStringList& names) { return m_folders.addFolder(folder, names); }
+    void nextPage();
+    void previousPage();
+    // A page of the basket's own pictures, from its reading position on.
+    void chosenPage();
+    // The copies of the cells are read from the basket again.
+    void markPage();
+    // No folder, no page and nothing chosen.
+    void clear();
+
+    // A picture that is chosen already keeps its copies and its place in the basket. An empty record in the short form.
+    void choose(int cell, const QString& record);
+    // The rest of a line stays, its record included; record is for a line that is not there. 0 takes the line out.
+    void setCopies(int cell, int copies, const QString& record);
+    // One copy of every picture of the folders.
+    void chooseAll();
+    // The index of the line that has the record now, or -1 when the picture is not chosen.
+    int storeRecord(const QString& path, const QString& record);
+    void removeDuplicates() { m_basket.removeDuplicates(); }
+
+private:
+    PrintCode code(int copies, PaperWords words);
+    void put(const BasketLine& line);
+    void turnTo(const QStringList& paths);
+
+    const OrderDetails& m_order;
+    Basket m_basket;
+    FolderPager m_folders;
+    TextList m_page;
+    std::array<int, cellsOfPage> m_copies{};
+    QChar m_paper = u' '; // the letter of the line before, for a paper word that is not known
+};
+
+} // namespace lumora

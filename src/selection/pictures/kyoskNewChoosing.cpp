@@ -1,0 +1,146 @@
+// The page of pictures: choosing, counting, the whole folder, and what the editor stores.
+#include "common/DrivePathText.h"
+#include "editing/editor/tFrmNew.h"
+#include "editing/render/StoredSmallView.h"
+#include "order/EditRecord.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "selection/HandOverFiles.h"
+#include "selection/pictures/kyoskNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+namespace lumora {
+
+void kyoskNew::choosePicture(int cell) {
+    const QString path = m_choice.path(cell);
+    if (path.isEmpty())
+        return;
+    if (plain()) {
+        m_choice.choose(cell, {});
+        showLarge(path);
+    } else {
+        leaveEditor();
+        takeIntoEditor(path);
+        m_choice.choose(cell, m_state.edit.EditState);
+    }
+    Label1.text = Label2.text = path;
+    showChoice();
+    if (plain())
+        return;
+    m_openCell = -1;
+    editor().openPicture();
+    if (!editor().pictureOpen())
+        return; // it was told; the picture stays in the basket as it was
+    m_openCell = cell;
+    m_chain.follow(pageId, Outcome::EditorWanted);
+    Q_EMIT changed();
+}
+
+// The session's edit fields become those of the picture.
+void kyoskNew::takeIntoEditor(const QString& path) {
+    const std::optional<QString> record = m_choice.recordOf(path);
+    // What an earlier choice of the same picture left behind would show it changed.
+    if (!record)
+        StoredSmallView::discard(m_state, m_platform.files, path);
+    m_state.edit.PicturePath = path;
+    UnpackEditState(record.value_or(EditRecord::newPicture()), m_state.edit);
+    if (m_state.edit.RedMarker == EditRecord::corrected)
+        m_state.edit.TempRedName = MangleFileName(path);
+    Label24.text = m_state.edit.EditState;
+}
+
+tFrmNew& kyoskNew::editor() const {
+    return *m_chain.find<tFrmNew>();
+}
+
+// What is in hand is let go and packed before another picture's fields take the place of these: a zoom that is still
+// held, a caption that was dragged and, by its own rule, not packed. What was seen is what prints.
+void kyoskNew::leaveEditor() {
+    editor().stopHolds();
+    editor().keepRecord();
+    storeSmallView();
+    repaint(m_state.edit.PicturePath);
+}
+
+void kyoskNew::addCopies(int cell, int more) {
+    if (!m_choice.path(cell).isEmpty())
+        setCopies(cell, m_choice.copies(cell) + more);
+}
+
+void kyoskNew::setCopies(int cell, int copies) {
+    const QString path = m_choice.path(cell);
+    const bool wasInBasket = m_choice.inBasket(path);
+    m_choice.setCopies(cell, copies, m_state.edit.EditState);
+    if (!m_choice.chosen(cell)) {
+        if (m_openCell == cell)
+            m_openCell = -1;
+        if (!plain() && wasInBasket)
+            repaint(path); // as the file is: chosen again it begins without its edits
+    }
+    showChoice();
+}
+
+void kyoskNew::cancelPage() {
+    for (int cell = 0; cell < cellsOfPage; ++cell) {
+        if (m_choice.chosen(cell))
+            setCopies(cell, 0);
+    }
+}
+
+void kyoskNew::chooseWholeFolder() {
+    m_choice.chooseAll();
+    Timer2.stop();
+    for (Caption* part : {&Label35, &Image13, &Label36, &Image20})
+        part->visible = false;
+    Image7.visible = true;
+    m_choice.previousPage();
+    drawPage();
+}
+
+void kyoskNew::chooseByHand() {
+    showGuide(Guide::ChooseByHand);
+    Q_EMIT changed();
+}
+
+void kyoskNew::beginAgain() {
+    cancelPage();
+    ++m_drawing;
+    Timer1.stop();
+    Timer2.stop();
+    for (Caption* part : {&Image19, &Image20, &Label36, &Frame1, &Picture66})
+        part->visible = false;
+    m_choice.clear();
+    Label29.text.clear();
+    showPictureCount();
+    clearCells();
+    showChoice();
+}
+
+void kyoskNew::storeSmallView() {
+    if (m_state.edit.PicturePath.trimmed().isEmpty())
+        return;
+    const Bitmap preview = editor().takeSmallView();
+    if (preview.isNull())
+        return; // what was stored last still holds
+    const Result<void> stored = StoredSmallView::store(m_state, m_platform.files, m_state.edit.PicturePath, preview);
+    if (!stored)
+        m_platform.dialogs.message(stored.failure().message);
+}
+
+void kyoskNew::storeRecord() {
+    const QString& path = m_state.edit.PicturePath;
+    const int index = path.isEmpty() ? -1 : m_choice.storeRecord(path, m_state.edit.EditState);
+    if (index < 0)
+        return;
+    showChoice();
+    const Result<void> written = writeHandOverFiles(m_state, m_platform.files, List1.items(), index);
+    if (!written && !m_handOverFailed)
+        m_platform.dialogs.message(written.failure().message);
+    m_handOverFailed = !written;
+    // Behind the editor the small picture waits until the customer comes back.
+    if (m_chain.front() == this)
+        repaint(path);
+}
+
+} // namespace lumora
