@@ -9,9 +9,8 @@
 
 namespace lumora {
 
-// The basket: lines in the order of first choice, a replaced line stays in its place. A picture stands in it once,
-// found by its path. Finding is as fast with thousands of lines as with ten, since twelve are looked for at each page
-// change.
+// The basket of an order: its lines in the order of first choice. A replaced line stays in its place. Each page change
+// looks for twelve paths, so that finding a line takes as long among thousands of lines as among ten.
 class Basket {
 public:
     // The form of all lines; given once, while the basket is empty.
@@ -49,8 +48,7 @@ private:
     LineForm m_form = LineForm::Short;
     TextList m_lines;
     long long m_copies = 0;
-    // Each line keeps a number of its own, rising through the list, so that a path leads to its line also when lines
-    // before it were removed.
+    // A number for each line, rising through the list: a path leads to its line also when lines before it were removed.
     std::vector<unsigned> m_ids;
     unsigned m_nextId = 0;
     mutable QHash<QString, unsigned> m_byPath; // the number of the first line of each path

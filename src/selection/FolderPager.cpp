@@ -26,7 +26,7 @@ void FolderPager::clear() {
 int FolderPager::addFolder(const QString& folder, const QStringList& names) {
     const int lastBefore = m_paths.lastIndex();
     for (const QString& name : names) {
-        // Only a root ends in the backslash that makes a path of the two: "1.jpg" of a folder "a" is not "a1.jpg".
+        // Only a root ends in a backslash: "1.jpg" of the folder "a" is not the file "a1.jpg".
         if (folder.endsWith(u'\\') && IsInFolderList(folder + name))
             continue;
         const QString path = JoinDrivePath(folder, name);

@@ -27,17 +27,16 @@ public:
 
     void clear();
 
-    // Adds the files of a folder. A file is left out when folder and name joined as they stand are in the list already,
-    // which can only be for a drive root, since its path alone ends in a backslash: an ordinary folder that is picked
-    // twice stands twice. When the list grew, the reading position becomes the last of the old items, or the first
-    // picture. Returns how many were added.
+    // Adds the files of a folder and returns how many it added. A drive root that is picked twice stands once in the
+    // list, any other folder twice: a file is left out when folder and name, joined without a separator, are in the
+    // list. When the list grew, the reading position becomes the last of the old items, or the first picture.
     int addFolder(const QString& folder, const QStringList& names);
 
     bool IsInFolderList(const QString& path) const { return m_known.contains(path); }
 
     // The next page.
     QStringList FillPageList();
-    // The page in view and the one before it are 24 items; below that the first page follows.
+    // Goes back by 24 items, the page in view and the one before it, or to the first item.
     void PageBack();
 
 private:

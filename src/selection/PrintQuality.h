@@ -6,8 +6,8 @@
 
 namespace lumora {
 
-// How well a picture of so many pixels prints. It is advice and blocks nothing; neither the paper nor an edit plays a
-// part.
+// How well a picture of so many pixels prints, whatever the paper and the edits. The grade is advice and blocks
+// nothing.
 enum class PrintGrade {
     Good,       // above 800000 pixels
     Unmarked,   // exactly 800000: the text of the picture before stays

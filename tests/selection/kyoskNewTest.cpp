@@ -207,10 +207,7 @@ TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
     state.Optint = OrderKind::Sequence;
     kyoskNew& page = openWith(14);
     ASSERT_TRUE(page.controls().Picture66.visible);
-    page.Picture1_Click(0);
-    page.Command12_Click(0);
     page.Command26_Click(0);
-    EXPECT_EQ(page.controls().List1.count(), 14);
     EXPECT_EQ(page.controls().Label7.text, u"14"_s);
     EXPECT_EQ(page.controls().List2.item(0), first);
     EXPECT_TRUE(page.controls().Picture4[11].visible);
@@ -338,12 +335,15 @@ TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
 
 TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     state.Optint = OrderKind::EditedPrint;
+    state.shemot.ppr = u"30/45"_s;
+    state.MediniyutDchisa = 1;
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
     editor().Image15_Click();
     editor().Image2_MouseDown(0);
     editor().Timer2_Tick(); // still held, and the editor not left
     page.Image7_Click();
+    EXPECT_FALSE(page.controls().Picture7.visible) << "deep compression is asked for plain orders only";
     page.Command7_Click();
     ASSERT_EQ(chain.front()->id(), PageId::B3);
     EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 6), u"270102"_s);
@@ -431,26 +431,6 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     page.Command28_Click();
     page.Command8_Click();
     EXPECT_EQ(state.shemot.Hearot, u" - חיפה"_s);
-}
-
-TEST_F(ThePictures, onLargePaperAreCompressedAsAskedInPlainModesOnly) {
-    state.shemot.ppr = u"30/45"_s;
-    for (const auto& [mode, policy, asked, on] :
-         {std::tuple{1, 2, false, 1}, {1, 1, true, 0}, {2, 1, false, 0}, {10, 2, false, 1}}) {
-        static_cast<void>(machine.files.removeFile(first));
-        state.Optint = static_cast<OrderKind>(mode);
-        state.MediniyutDchisa = static_cast<std::int16_t>(policy);
-        state.DchisaAmoka = 1; // of an order before
-        chain.unload(PageId::kyoskNew);
-        kyoskNew& page = openWith(1);
-        page.Picture1_Click(0);
-        page.Image7_Click();
-        EXPECT_EQ(page.controls().Picture7.visible, asked);
-        EXPECT_EQ(state.DchisaAmoka, on);
-        page.Command21_Click();
-        EXPECT_EQ(state.DchisaAmoka, 1);
-        EXPECT_FALSE(page.controls().Picture7.visible);
-    }
 }
 
 TEST_F(ThePictures, areNotLeftWithoutAQuestionOnceSomeAreChosen) {

@@ -31,7 +31,7 @@ void kyoskNew::choosePicture(int cell) {
     m_openCell = -1;
     editor().openPicture();
     if (!editor().pictureOpen())
-        return; // it was told; the picture stays in the basket as it was
+        return; // the editor has told why; the picture stays in the basket as it was
     m_openCell = cell;
     m_chain.follow(pageId, Outcome::EditorWanted);
     Q_EMIT changed();
@@ -40,7 +40,7 @@ void kyoskNew::choosePicture(int cell) {
 // The session's edit fields become those of the picture.
 void kyoskNew::takeIntoEditor(const QString& path) {
     const std::optional<QString> record = m_choice.recordOf(path);
-    // What an earlier choice of the same picture left behind would show it changed.
+    // The stored view of an earlier choice would show the picture changed.
     if (!record)
         StoredSmallView::discard(m_state, m_platform.files, path);
     m_state.edit.PicturePath = path;
@@ -54,8 +54,8 @@ tFrmNew& kyoskNew::editor() const {
     return *m_chain.find<tFrmNew>();
 }
 
-// What is in hand is let go and packed before another picture's fields take the place of these: a zoom that is still
-// held, a caption that was dragged and, by its own rule, not packed. What was seen is what prints.
+// A held zoom is let go and a dragged caption is packed before the next picture's fields replace these, so that the
+// print is what the customer saw.
 void kyoskNew::leaveEditor() {
     editor().stopHolds();
     editor().keepRecord();
@@ -138,7 +138,7 @@ void kyoskNew::storeRecord() {
     if (!written && !m_handOverFailed)
         m_platform.dialogs.message(written.failure().message);
     m_handOverFailed = !written;
-    // Behind the editor the small picture waits until the customer comes back.
+    // Behind the editor the small picture is painted when the customer comes back.
     if (m_chain.front() == this)
         repaint(path);
 }

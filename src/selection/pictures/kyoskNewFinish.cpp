@@ -30,7 +30,7 @@ void kyoskNew::checkAndClose() {
     Combo1.text = mailDomainPrompt(m_state.english());
     if (couponRefuses())
         return;
-    m_state.DchisaAmoka = 0; // that of an order before is none of this one
+    m_state.DchisaAmoka = 0; // an order before may have set it
     if (plain()) {
         const DeepCompression deep = deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa);
         m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
@@ -73,7 +73,7 @@ void kyoskNew::openClosingPanel() {
     Q_EMIT changed();
 }
 
-// Whatever lies above the page of pictures.
+// Closes every panel above the cells.
 void kyoskNew::closeFinish() {
     for (Caption* panel : {&PicB4Sioom, &Frame4, &Pic4snifim, &Pic4Snif, &Picture7})
         panel->visible = false;
@@ -90,7 +90,7 @@ void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
         Command4Snif[branch].text = m_state.profile.Branches[branch].caption;
-    // The shops have the names that the lab gives them; home delivery is a word of ours.
+    // The lab names the shops; home delivery is our own word.
     if (m_state.english())
         Command4Snif.back().text = u"Home delivery"_s;
     // A lab with fewer shops leaves captions empty.
@@ -149,7 +149,7 @@ void kyoskNew::goOnWithoutAddress() {
     handOver(plain() ? u"לא הוקלד"_s : m_state.shemot.Mail);
 }
 
-// Once: a second press that arrives while the page yields finds the basket on its way.
+// A second press that arrives while the page yields does nothing.
 void kyoskNew::handOver(const QString& mail) {
     if (m_handedOver)
         return;

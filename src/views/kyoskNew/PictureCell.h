@@ -7,8 +7,8 @@ class QPushButton;
 
 namespace lumora {
 
-// One of the twelve small pictures: a press chooses it; once chosen it wears a mark, and minus, the number of copies
-// and plus lie below. The keys + and - count too, and the arrows go to the neighbours.
+// One of the twelve small pictures. A press chooses it; a chosen one has a mark, and minus, the number of copies and
+// plus below. The keys + and - count too, and the arrows go to the neighbours.
 class PictureCell : public CardButton {
     Q_OBJECT
 public:

@@ -61,7 +61,7 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     m_body = new QStackedLayout(body);
     m_body->addWidget(makeEmpty());
     auto* pictures = new QWidget(body);
-    // The small pictures stand on the left in both languages, and run from left to right: so the page's texts say.
+    // The small pictures stand on the left and run from left to right in both languages, as the page's texts say.
     pictures->setLayoutDirection(Qt::LeftToRight);
     auto* row = new QHBoxLayout(pictures);
     row->setContentsMargins(0, 0, 0, 0);
