@@ -36,14 +36,6 @@ TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
     }
 }
 
-TEST(TileMenuTest, NamesTheBordersByTheirCodes) {
-    QStringList codes;
-    for (int i = 0; i < 10; ++i)
-        codes += borderCode(i);
-    EXPECT_EQ(codes, QStringList({"NB", "B7", "BB1", "BB2", "CA1", "BB", "CA9", "BL1", "FA9", "WB"}));
-    EXPECT_TRUE(borderCode(-1).isEmpty() && borderCode(10).isEmpty());
-}
-
 TEST(TimeOfJobTest, HasDayCodeAndVolumeInFixedPlaces) {
     EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), u"KUP"_s, u"1234"_s), u"2026_11_21_KUP_1234^");
     EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), u"P"_s, QString()), u"0987_01_02_P  _^");
@@ -62,7 +54,7 @@ TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
 TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
     using Place = DetailsProblem::Place;
     SessionState good;
-    takeDetails(good, u" Dana Levi "_s, u"call me"_s, QString());
+    takeDetails(good.shemot, u" Dana Levi "_s, u"call me"_s, QString());
     good.shemot.ppr = u"10/15"_s;
     good.shemot.maat = u"מט"_s;
     good.shemot.Bord = u"NB"_s;

@@ -131,8 +131,8 @@ TEST(Keyboard, PutsAnAlbumTogetherWithoutAMouse) {
     }
     press(walk, u"Check3(5)"_s, Qt::Key_Space);
     key(walk, Qt::Key_Escape);
-    const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album;
-    EXPECT_EQ(album.panel, AlbumPanels::Panel::Paper) << "Esc goes one panel back";
+    const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album();
+    EXPECT_EQ(album.panel(), AlbumPanels::Panel::Paper) << "Esc goes one panel back";
     press(walk, u"Command20"_s);
     press(walk, u"Command21"_s);
     ASSERT_EQ(focusName(), u"Check6"_s);

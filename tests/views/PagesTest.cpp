@@ -138,7 +138,7 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     walk.toMenu();
     walk.press(u"nnn"_s, u"Image1(2)"_s);
     walk.toOptions();
-    const auto& sizes = walk.page<nnn>(PageId::nnn).Combo1List;
+    const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;
     ASSERT_TRUE(
         ControlFinder(walk.program().window()).choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex())).ok());
     walk.press(u"nnn"_s, u"Option3(0)"_s);
@@ -197,7 +197,7 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     walk.press(u"nnn"_s, u"Image1(6)"_s);
     const ControlFinder finder(walk.program().window());
     const auto lookAtRest = [&](const QString& name) {
-        const AlbumPanels& album = walk.page<nnn>(PageId::nnn).album;
+        const AlbumControls& album = walk.page<nnn>(PageId::nnn).album().controls();
         EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }));
         look(walk, name);
     };

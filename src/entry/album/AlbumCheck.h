@@ -20,7 +20,7 @@ struct AlbumProblem {
 std::optional<AlbumProblem> CheckAlbum(const SessionState& state, const QString& mailName);
 
 // On the panel of the kind: copies for the parents need a kind of album and a size. The message, when one is missing.
-std::optional<QString> checkParentAlbum(const SessionState& state, const QString& copies, bool chosen);
+std::optional<QString> checkParentAlbum(const SessionState& state, int copies, bool chosen);
 
 // What a checked album leaves in the record, over anything that an earlier order left there.
 void takeAlbumOrder(SessionState& state);

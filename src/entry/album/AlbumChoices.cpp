@@ -2,6 +2,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 struct AlbumList {
@@ -14,41 +16,40 @@ struct AlbumList {
 AlbumList listOf(AlbumChoice choice) {
     switch (choice) {
     case AlbumChoice::Kind:
-        return {u" בחר סוג אלבום"_qs,
-                u"Choose the album kind"_qs,
-                {u"אינדיגו  סבתא"_qs, u"אינדיגו  ספירלה"_qs, u"אינדיגו הורים"_qs, u"אינדיגו גדול"_qs, u"פוטו הורים"_qs,
-                 u"פוטו גדול"_qs},
-                {u"Indigo grandma"_qs, u"Indigo spiral"_qs, u"Indigo parents"_qs, u"Indigo large"_qs,
-                 u"Photo parents"_qs, u"Photo large"_qs}};
+        return {u" בחר סוג אלבום"_s,
+                u"Choose the album kind"_s,
+                {u"אינדיגו  סבתא"_s, u"אינדיגו  ספירלה"_s, u"אינדיגו הורים"_s, u"אינדיגו גדול"_s, u"פוטו הורים"_s,
+                 u"פוטו גדול"_s},
+                {u"Indigo grandma"_s, u"Indigo spiral"_s, u"Indigo parents"_s, u"Indigo large"_s, u"Photo parents"_s,
+                 u"Photo large"_s}};
     case AlbumChoice::ParentSize:
-        return {u"סוג אלבום הורים"_qs,
-                u"Parent album kind"_qs,
-                {u"20/40"_qs, u"20/54"_qs, u"25/50"_qs, u"30/40"_qs, u"30/60"_qs},
+        return {u"סוג אלבום הורים"_s,
+                u"Parent album kind"_s,
+                {u"20/40"_s, u"20/54"_s, u"25/50"_s, u"30/40"_s, u"30/60"_s},
                 {}};
     case AlbumChoice::Size:
-        return {u"בחר גודל אלבום"_qs,
-                u"Choose the album size"_qs,
-                {u"20/54"_qs, u"30/45"_qs, u"30/60"_qs, u"30/80"_qs, u"40/60"_qs, u"40/80"_qs},
+        return {u"בחר גודל אלבום"_s,
+                u"Choose the album size"_s,
+                {u"20/54"_s, u"30/45"_s, u"30/60"_s, u"30/80"_s, u"40/60"_s, u"40/80"_s},
                 {}};
     case AlbumChoice::Cover:
-        return {u"בחר סוג כריכה"_qs, u"Choose the cover"_qs, {u"חום"_qs, u"קרם"_qs}, {u"Brown"_qs, u"Cream"_qs}};
+        return {u"בחר סוג כריכה"_s, u"Choose the cover"_s, {u"חום"_s, u"קרם"_s}, {u"Brown"_s, u"Cream"_s}};
     case AlbumChoice::Paper:
-        return {u"בחר סוג נייר"_qs,
-                u"Choose the paper"_qs,
-                {u"מבריק"_qs, u"מט"_qs, u"משי"_qs},
-                {u"Glossy"_qs, u"Matte"_qs, u"Silk"_qs}};
+        return {u"בחר סוג נייר"_s,
+                u"Choose the paper"_s,
+                {u"מבריק"_s, u"מט"_s, u"משי"_s},
+                {u"Glossy"_s, u"Matte"_s, u"Silk"_s}};
     case AlbumChoice::Extra:
-        return {u"בחר תוספת"_qs,
-                u"Choose an extra"_qs,
-                {u"ללא"_qs, u"קנבס"_qs, u"פלטה- סובלימציה"_qs, u"פרספקט"_qs},
-                {u"None"_qs, u"Canvas"_qs, u"Sublimation plate"_qs, u"Perspex"_qs}};
+        return {u"בחר תוספת"_s,
+                u"Choose an extra"_s,
+                {u"ללא"_s, u"קנבס"_s, u"פלטה- סובלימציה"_s, u"פרספקט"_s},
+                {u"None"_s, u"Canvas"_s, u"Sublimation plate"_s, u"Perspex"_s}};
     case AlbumChoice::SpecialExtra:
         return {
-            u"  תוספות מיוחדות"_qs,
-            u"Special extras"_qs,
-            {u"עוד"_qs, u"הטבעת שם בכריכה"_qs, u"פינות עגולות"_qs, u"מזוודה"_qs, u"סובלימציה"_qs, u"פתיחה אנגלית"_qs},
-            {u"More"_qs, u"Name on the cover"_qs, u"Round corners"_qs, u"Case"_qs, u"Sublimation"_qs,
-             u"English opening"_qs}};
+            u"  תוספות מיוחדות"_s,
+            u"Special extras"_s,
+            {u"עוד"_s, u"הטבעת שם בכריכה"_s, u"פינות עגולות"_s, u"מזוודה"_s, u"סובלימציה"_s, u"פתיחה אנגלית"_s},
+            {u"More"_s, u"Name on the cover"_s, u"Round corners"_s, u"Case"_s, u"Sublimation"_s, u"English opening"_s}};
     }
     return {};
 }

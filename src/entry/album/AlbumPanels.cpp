@@ -13,63 +13,69 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int slideFrom = 48;
 constexpr int slideStep = 16;
 constexpr int slidePace = 16; // milliseconds, about a frame of the screen
 
-QString nameOf(const char* array, int index) {
-    return QStringLiteral("%1(%2)").arg(QLatin1String(array)).arg(index);
-}
-
 } // namespace
 
-AlbumPanels::AlbumPanels(SessionState& state, const Platform& platform)
-    : m_state(state)
+AlbumPanels::AlbumPanels(SessionState& state, const Platform& platform, Controls& of)
+    : AlbumControls(of)
+    , m_state(state)
     , m_platform(platform)
     , Timer4Alboom(slidePace, [this] { Timer4Alboom_Tick(); })
     , Timer7(slidePace, [this] { Timer7_Tick(); }) {
-    Pic4Alboom.visible = false;
     Label17.text = notChosen;
-    Label32.text = QStringLiteral("0");
+    Label32.text = u"0"_s;
+}
+
+bool AlbumPanels::english() const {
+    return m_state.english();
 }
 
 void AlbumPanels::begin() {
-    fill(Combo4Mail, mailDomains(), mailDomainPrompt(m_state.english()));
+    Combo4Mail.fill(mailDomains(), mailDomainPrompt(english()));
     greyKinds();
     m_kind = -1;
     Label17.text = notChosen;
-    Check4.checked = false;
-    setCopies(0);
-    fill(Combo4Horim, {}, promptOf(AlbumChoice::ParentSize));
+    addParents(false);
+    Combo4Horim.fill({}, promptOf(AlbumChoice::ParentSize));
     Label36.text.clear();
-    for (const auto& [choice, list] : {std::pair{&Combo4Godel, AlbumChoice::Size},
-                                       {&Combo4Cricha, AlbumChoice::Cover},
-                                       {&Combo4Niyar, AlbumChoice::Paper},
-                                       {&Combo4Tosefet, AlbumChoice::Extra}})
-        fill(*choice, {}, promptOf(list));
+    for (const ListRow& row : listTable())
+        row.list.fill({}, promptOf(row.choice));
     for (CheckCaption& extra : Check3)
         extra.checked = false;
     Check6.checked = false;
     Pic4Alboom.visible = true;
     open(Panel::Photographer);
-    Q_EMIT focusWanted(nameOf("Text1", 0));
+    Q_EMIT focusWanted(u"Text1(0)"_s);
 }
 
 void AlbumPanels::close() {
-    Timer4Alboom.stop();
-    Timer7.stop();
-    panelShift = parentsShift = 0;
+    stopSliding();
     Pic4Alboom.visible = false;
     showPanel();
 }
 
 bool AlbumPanels::back() {
-    if (panel == Panel::Photographer)
+    if (m_panel == Panel::Photographer)
         return false;
-    open(static_cast<Panel>(static_cast<int>(panel) - 1));
+    open(static_cast<Panel>(static_cast<int>(m_panel) - 1));
     return true;
+}
+
+void AlbumPanels::tick(CheckCaption& box, bool checked) {
+    box.checked = checked;
+    Q_EMIT changed();
+}
+
+void AlbumPanels::take(ComboCaption& list, int row) {
+    if (list.take(row))
+        showPanel();
 }
 
 // --- who ---
@@ -79,27 +85,19 @@ void AlbumPanels::Text1_Change(int box, const QString& text) {
     Q_EMIT changed();
 }
 
-void AlbumPanels::Combo4Mail_Change(const QString& text) {
-    Combo4Mail.list.setCurrentIndex(-1);
-    Combo4Mail.box.text = text;
+void AlbumPanels::typeDomain(const QString& text) {
+    Combo4Mail.rows.setCurrentIndex(-1);
+    Combo4Mail.text = text;
     Q_EMIT changed();
 }
 
-void AlbumPanels::Combo4Mail_Click(int row) {
-    take(Combo4Mail, row);
-}
-
-void AlbumPanels::Check5_Click(bool checked) {
-    Check5.checked = checked;
-    Q_EMIT changed();
-}
-
-void AlbumPanels::Command28_Click() {
+void AlbumPanels::recallPhotographer() {
     const Result<std::optional<DetailStore::Photographer>> stored =
         DetailStore(m_state, m_platform.files).albumDetails();
     if (!stored || !*stored) {
-        m_platform.dialogs.message(stored ? detailsMessages(m_state.english())[0] : stored.failure().message);
-        Q_EMIT focusWanted(nameOf("Text1", 0));
+        m_platform.dialogs.message(stored ? detailsMessage(DetailsMessage::NothingStored, english())
+                                          : stored.failure().message);
+        Q_EMIT focusWanted(u"Text1(0)"_s);
         return;
     }
     const std::pair<std::size_t, QString> fields[] = {
@@ -111,7 +109,7 @@ void AlbumPanels::Command28_Click() {
     Q_EMIT changed();
 }
 
-void AlbumPanels::Command17_Click() {
+void AlbumPanels::leavePhotographer() {
     if (Check5.checked) {
         const Result<void> saved =
             DetailStore(m_state, m_platform.files).SaveAlbumDetails({Text1[0].text, Text1[1].text, Text1[3].text});
@@ -132,7 +130,7 @@ void AlbumPanels::greyKinds() {
     }
 }
 
-void AlbumPanels::SoogAlb_Click(int kind) {
+void AlbumPanels::takeKind(int kind) {
     if (kind < 0 || kind >= static_cast<int>(SoogAlb.size()))
         return;
     const auto at = static_cast<std::size_t>(kind);
@@ -141,124 +139,75 @@ void AlbumPanels::SoogAlb_Click(int kind) {
     SoogAlb[at].checked = true;
     m_kind = kind;
     Label17.text = Label28[at].text;
-    // Added to what is there: each kind that is looked at brings its five.
-    Combo4Horim.list.append(itemsOf(AlbumChoice::ParentSize));
-    Combo4Horim.list.setCurrentIndex(-1);
-    Combo4Horim.box.text = promptOf(AlbumChoice::ParentSize);
+    // Each kind that is looked at adds its five sizes to those that are there.
+    Combo4Horim.fill(Combo4Horim.rows.items() + itemsOf(AlbumChoice::ParentSize), promptOf(AlbumChoice::ParentSize));
     Label36.text.clear();
     parentsShift = slideFrom;
     Timer4Alboom.start();
     showPanel();
 }
 
-void AlbumPanels::Check4_Click(bool checked) {
-    Check4.checked = checked;
-    setCopies(checked ? 1 : 0);
+void AlbumPanels::addParents(bool wanted) {
+    Check4.checked = wanted;
+    setCopies(wanted ? 1 : 0);
 }
 
 void AlbumPanels::setCopies(int copies) {
+    m_copies = copies;
     Label32.text = QString::number(copies);
     showPanel();
 }
 
-void AlbumPanels::Command26_Click() {
-    const int copies = Label32.text.toInt() - 1;
-    if (copies <= 0)
-        Check4_Click(false);
+void AlbumPanels::oneCopyLess() {
+    if (m_copies > 1)
+        setCopies(m_copies - 1);
     else
-        setCopies(copies);
+        addParents(false);
 }
 
-void AlbumPanels::Command27_Click() {
-    setCopies(std::min(Label32.text.toInt() + 1, mostParentCopies));
+void AlbumPanels::oneCopyMore() {
+    setCopies(std::min(m_copies + 1, mostParentCopies));
 }
 
-void AlbumPanels::Combo4Horim_Click(int row) {
-    take(Combo4Horim, row);
-    Label36.text = Combo4Horim.list.currentItem();
+void AlbumPanels::takeParentSize(int row) {
+    Combo4Horim.take(row);
+    Label36.text = Combo4Horim.rows.currentItem();
     showPanel();
 }
 
-void AlbumPanels::Command16_Click() {
-    const bool parentsChosen = Label17.text != notChosen && Combo4Horim.list.currentIndex() >= 0;
-    if (const std::optional<QString> problem = checkParentAlbum(m_state, Label32.text, parentsChosen)) {
+void AlbumPanels::leaveKind() {
+    if (const std::optional<QString> problem =
+            checkParentAlbum(m_state, m_copies, m_kind >= 0 && Combo4Horim.taken())) {
         m_platform.dialogs.message(*problem);
-        Q_EMIT focusWanted(Label17.text == notChosen ? nameOf("SoogAlb", 0) : QStringLiteral("Combo4Horim"));
+        Q_EMIT focusWanted(m_kind < 0 ? u"SoogAlb(0)"_s : u"Combo4Horim"_s);
         return;
     }
-    for (Choice* choice : {&Combo4Cricha, &Combo4Niyar, &Combo4Tosefet})
-        choice->list.clear();
-    Command18_Click();
-    Command19_Click();
-    Command20_Click();
-    fill(Combo4Godel, itemsOf(AlbumChoice::Size), promptOf(AlbumChoice::Size));
+    for (const ListRow& row : listTable())
+        row.list.fill(itemsOf(row.choice), promptOf(row.choice));
     open(Panel::Size);
 }
 
-// --- size, cover, paper, extras: a list that is filled keeps what was taken when the panel is passed again ---
+// --- size, cover, paper, extras ---
 
-void AlbumPanels::Combo4Godel_Click(int row) {
-    take(Combo4Godel, row);
+// A list that is filled keeps what was taken when its panel is passed again.
+void AlbumPanels::goOnTo(Panel next) {
+    for (const ListRow& row : listTable()) {
+        if (row.panel == next && row.list.rows.isEmpty())
+            row.list.fill(itemsOf(row.choice), promptOf(row.choice));
+    }
+    open(next);
 }
 
-void AlbumPanels::Command18_Click() {
-    if (Combo4Cricha.list.isEmpty())
-        fill(Combo4Cricha, itemsOf(AlbumChoice::Cover), promptOf(AlbumChoice::Cover));
-    open(Panel::Cover);
-}
-
-void AlbumPanels::Combo4Cricha_Click(int row) {
-    take(Combo4Cricha, row);
-}
-
-void AlbumPanels::Command19_Click() {
-    if (Combo4Niyar.list.isEmpty())
-        fill(Combo4Niyar, itemsOf(AlbumChoice::Paper), promptOf(AlbumChoice::Paper));
-    open(Panel::Paper);
-}
-
-void AlbumPanels::Combo4Niyar_Click(int row) {
-    take(Combo4Niyar, row);
-}
-
-void AlbumPanels::Command20_Click() {
-    if (Combo4Tosefet.list.isEmpty())
-        fill(Combo4Tosefet, itemsOf(AlbumChoice::Extra), promptOf(AlbumChoice::Extra));
-    open(Panel::Extras);
-}
-
-void AlbumPanels::Combo4Tosefet_Click(int row) {
-    take(Combo4Tosefet, row);
-}
-
-void AlbumPanels::Check3_Click(int extra, bool checked) {
-    Check3.at(static_cast<std::size_t>(extra)).checked = checked;
-    Q_EMIT changed();
-}
-
-void AlbumPanels::Command21_Click() {
-    Command23_Click();
+void AlbumPanels::goOnToBill() {
+    gather();
     open(Panel::Bill);
 }
 
 // --- the end ---
 
-void AlbumPanels::Check6_Click(bool checked) {
-    Check6.checked = checked;
-    Q_EMIT changed();
-}
-
-void AlbumPanels::Command23_Click() {
+void AlbumPanels::finish() {
     gather();
-    writeBill();
-    Q_EMIT changed();
-}
-
-void AlbumPanels::Command22_Click() {
-    Command23_Click();
-    Timer4Alboom.stop();
-    Timer7.stop();
-    panelShift = parentsShift = 0;
+    stopSliding();
     if (const std::optional<AlbumProblem> problem = CheckAlbum(m_state, Text1[3].text)) {
         refuse(*problem);
         return;
@@ -267,6 +216,7 @@ void AlbumPanels::Command22_Click() {
     Q_EMIT checked();
 }
 
+// All fields of the panels into the session, and from there onto the bill.
 void AlbumPanels::gather() {
     AlbumDetails album; // of an album before nothing stays
     album.ShemZalam = Text1[0].text.trimmed();
@@ -274,89 +224,68 @@ void AlbumPanels::gather() {
     album.ShemErooa = Text1[2].text.trimmed();
     album.MailZalam = mailAddress();
     album.SoogLBM = Label17.text;
-    album.SoogKricha = Combo4Cricha.box.text;
-    album.SoogNiar = Combo4Niyar.box.text;
-    album.Tosafot1[0] = Combo4Tosefet.box.text;
+    album.SoogKricha = Combo4Cricha.text;
+    album.SoogNiar = Combo4Niyar.text;
+    album.Tosafot1[0] = Combo4Tosefet.text;
     for (std::size_t i = 0; i < Check3.size(); ++i)
         album.Tosafot2[i] = Check3[i].text + u'=' + QString::number(Check3[i].checked ? 1 : 0);
-    album.GodelLBM = Combo4Godel.box.text;
-    album.KamutHorim = Label32.text;
-    album.SoogHorim = Label36.text;
+    album.GodelLBM = Combo4Godel.text;
+    album.KamutHorim = QString::number(m_copies);
+    album.SoogHorim = Combo4Horim.rows.currentItem();
     m_state.album = album;
+    writeBill();
+    Q_EMIT changed();
 }
 
 // Who types the whole address into the first box means no other.
 QString AlbumPanels::mailAddress() const {
     const QString name = Text1[3].text.trimmed();
-    const QString domain = Combo4Mail.box.text.trimmed();
-    if (name.contains(u'@') && domain == mailDomainPrompt(m_state.english()))
-        return name;
-    return name + u'@' + domain;
+    const QString domain = Combo4Mail.text.trimmed();
+    return name.contains(u'@') && domain == mailDomainPrompt(english()) ? name : name + u'@' + domain;
 }
 
 // The panel on which the fault is set right comes forward.
 void AlbumPanels::refuse(const AlbumProblem& problem) {
     using Place = AlbumProblem::Place;
-    const auto show = [&](Panel where, const QString& control) {
-        m_platform.dialogs.message(problem.message);
-        open(where);
-        Q_EMIT focusWanted(control);
+    static const struct {
+        Place place;
+        Panel panel;
+        QString control;
+    } ways[] = {
+        {Place::Name, Panel::Photographer, u"Text1(0)"_s},  {Place::Telephone, Panel::Photographer, u"Text1(1)"_s},
+        {Place::Event, Panel::Photographer, u"Text1(2)"_s}, {Place::Mail, Panel::Photographer, u"Text1(3)"_s},
+        {Place::Kind, Panel::Kind, u"SoogAlb(0)"_s},        {Place::Size, Panel::Size, u"Combo4Godel"_s},
+        {Place::Cover, Panel::Cover, u"Combo4Cricha"_s},    {Place::Paper, Panel::Paper, u"Combo4Niyar"_s},
     };
-    switch (problem.place) {
-    case Place::Name:
-        return show(Panel::Photographer, nameOf("Text1", 0));
-    case Place::Telephone:
-        return show(Panel::Photographer, nameOf("Text1", 1));
-    case Place::Event:
-        return show(Panel::Photographer, nameOf("Text1", 2));
-    case Place::Mail:
-        return show(Panel::Photographer, nameOf("Text1", 3));
-    case Place::Kind:
-        return show(Panel::Kind, nameOf("SoogAlb", 0));
-    case Place::Size:
-        return show(Panel::Size, QStringLiteral("Combo4Godel"));
-    case Place::Cover:
-        return show(Panel::Cover, QStringLiteral("Combo4Cricha"));
-    case Place::Paper:
-        return show(Panel::Paper, QStringLiteral("Combo4Niyar"));
+    m_platform.dialogs.message(problem.message);
+    for (const auto& way : ways) {
+        if (way.place != problem.place)
+            continue;
+        open(way.panel);
+        Q_EMIT focusWanted(way.control);
     }
 }
 
 // --- the panels themselves ---
 
 void AlbumPanels::open(Panel next) {
-    panel = next;
+    m_panel = next;
     panelShift = slideFrom;
     Timer7.start();
     showPanel();
 }
 
-void AlbumPanels::Timer4Alboom_Tick() {
-    parentsShift = std::max(parentsShift - slideStep, 0);
-    if (parentsShift == 0)
-        Timer4Alboom.stop();
+void AlbumPanels::slide(int& shift, Ticker& timer) {
+    shift = std::max(shift - slideStep, 0);
+    if (shift == 0)
+        timer.stop();
     Q_EMIT changed();
 }
 
-void AlbumPanels::Timer7_Tick() {
-    panelShift = std::max(panelShift - slideStep, 0);
-    if (panelShift == 0)
-        Timer7.stop();
-    Q_EMIT changed();
-}
-
-void AlbumPanels::fill(Choice& choice, const QStringList& items, const QString& prompt) {
-    choice.list.clear();
-    choice.list.append(items);
-    choice.box.text = prompt;
-}
-
-void AlbumPanels::take(Choice& choice, int row) {
-    if (row < 0 || row >= choice.list.count())
-        return;
-    choice.list.setCurrentIndex(row);
-    choice.box.text = choice.list.currentItem();
-    showPanel();
+void AlbumPanels::stopSliding() {
+    Timer4Alboom.stop();
+    Timer7.stop();
+    panelShift = parentsShift = 0;
 }
 
 } // namespace lumora

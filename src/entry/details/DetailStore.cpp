@@ -8,11 +8,13 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-const QString customerStore = QStringLiteral("pratim.txt");
-const QString albumStore = QStringLiteral("pratim2.txt");
-const QString quickStore = QStringLiteral("pratim3.txt");
+const QString customerStore = u"pratim.txt"_s;
+const QString albumStore = u"pratim2.txt"_s;
+const QString quickStore = u"pratim3.txt"_s;
 
 // A line of up to four characters has at most two between its quotes: no name, no number.
 QString albumField(const QStringList& lines, int index) {
@@ -81,7 +83,7 @@ Result<std::optional<QStringList>> DetailStore::lines(const QString& name) const
     if (!bytes)
         return bytes.failure();
     QString text = AnsiCodePage::decode(*bytes);
-    text.replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
+    text.replace(u"\r\n"_s, u"\n"_s);
     if (text.endsWith(u'\n'))
         text.chop(1);
     return std::optional(text.split(u'\n'));

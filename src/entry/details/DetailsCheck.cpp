@@ -5,67 +5,65 @@
 
 namespace lumora {
 
-DetailsMessages detailsMessages(bool english) {
-    if (english)
-        return {QStringLiteral("No details in the memory\nPlease insert your details"),
-                QStringLiteral("Please insert First & Last Name"),
-                QStringLiteral("Please insert your Address"),
-                QStringLiteral("Please insert First & Last Name"),
-                QStringLiteral("Please insert your Address\nin the green Text Box"),
-                QStringLiteral("Please insert only Numbers"),
-                QStringLiteral("Please insert your Phone Number")};
-    return {QStringLiteral("לא נמצאו פרטים בזיכרון נא הקלד פרטים"),
-            QStringLiteral("נא להקליד שם ושם שפחה"),
-            QStringLiteral("בקשת שנשלח את התמונות עד הבית\nנא להקליד כתובת דואר"),
-            QStringLiteral("לא כתבת שם פרטי ומשפחה"),
-            QStringLiteral("עליך להקליד כתובתך ונדע לאן לשלוח את התמונות כפי שבקשת\nהקפד להקליד רחוב מיספר ועיר\nנא "
-                           "הקלד בחלונית הירוקה\nיש לוודא שהפרטים מדוייקים"),
-            QStringLiteral("הקש רק מספרים ומקף"),
-            QStringLiteral("לא כתבתה מספר טלפון")};
+QString detailsMessage(DetailsMessage message, bool english) {
+    static const struct {
+        const char16_t* hebrew;
+        const char16_t* english;
+    } texts[] = {
+        {u"לא נמצאו פרטים בזיכרון נא הקלד פרטים", u"No details in the memory\nPlease insert your details"},
+        {u"נא להקליד שם ושם שפחה", u"Please insert First & Last Name"},
+        {u"בקשת שנשלח את התמונות עד הבית\nנא להקליד כתובת דואר", u"Please insert your Address"},
+        {u"לא כתבת שם פרטי ומשפחה", u"Please insert First & Last Name"},
+        {u"עליך להקליד כתובתך ונדע לאן לשלוח את התמונות כפי שבקשת\nהקפד להקליד רחוב מיספר ועיר\n"
+         u"נא הקלד בחלונית הירוקה\nיש לוודא שהפרטים מדוייקים",
+         u"Please insert your Address\nin the green Text Box"},
+        {u"הקש רק מספרים ומקף", u"Please insert only Numbers"},
+        {u"לא כתבתה מספר טלפון", u"Please insert your Phone Number"},
+    };
+    const auto& text = texts[static_cast<int>(message)];
+    return QString::fromUtf16(english ? text.english : text.hebrew);
 }
 
 bool IsPhoneOk(const QString&) {
     return true;
 }
 
-void takeDetails(SessionState& state, const QString& name, const QString& telephone, const QString& address) {
-    state.shemot.n1 = name.trimmed();
-    state.shemot.n2 = telephone.trimmed();
-    state.shemot.n3 = address.trimmed();
+void takeDetails(OrderDetails& shemot, const QString& name, const QString& telephone, const QString& address) {
+    shemot.n1 = name.trimmed();
+    shemot.n2 = telephone.trimmed();
+    shemot.n3 = address.trimmed();
 }
 
 std::optional<DetailsProblem> checkTyped(const SessionState& state, const QString& name, const QString& address) {
     using Place = DetailsProblem::Place;
-    const DetailsMessages messages = detailsMessages(state.english());
     if (name.trimmed().isEmpty())
-        return DetailsProblem{messages[1], Place::Name};
+        return DetailsProblem{detailsMessage(DetailsMessage::NameBeforeOptions, state.english()), Place::Name};
     if (address.trimmed().isEmpty() && state.MishloachHabaita)
-        return DetailsProblem{messages[2], Place::Address};
+        return DetailsProblem{detailsMessage(DetailsMessage::AddressBeforeOptions, state.english()), Place::Address};
     return std::nullopt;
 }
 
 std::optional<DetailsProblem> CheckDetails(const SessionState& state) {
     using Place = DetailsProblem::Place;
     const OrderDetails& shemot = state.shemot;
-    const DetailsMessages messages = detailsMessages(state.english());
-    if (shemot.n1.isEmpty())
-        return DetailsProblem{messages[3], Place::Name};
-    if (shemot.n2.isEmpty())
-        return DetailsProblem{messages[6], Place::Telephone};
-    if (shemot.n3.isEmpty() && state.MishloachHabaita)
-        return DetailsProblem{messages[4], Place::Address};
-    if (shemot.ppr == notChosen)
-        return DetailsProblem{
-            state.wording(QStringLiteral("לא בחרת גודל נייר"), QStringLiteral("Please choose a paper size")),
-            Place::Size};
-    if (shemot.maat == notChosen)
-        return DetailsProblem{state.wording(QStringLiteral("לא בחר סוג נייר  מט או מבריק"),
-                                            QStringLiteral("Please choose a paper kind, matte or glossy")),
-                              Place::Kind};
-    if (shemot.Bord.isEmpty())
-        return DetailsProblem{
-            state.wording(QStringLiteral("לא בחרת סוג מסגרת"), QStringLiteral("Please choose a border")),
-            Place::Border};
+    const auto message = [&](DetailsMessage which) { return detailsMessage(which, state.english()); };
+    const struct {
+        bool missing;
+        Place place;
+        QString message;
+    } checks[] = {
+        {shemot.n1.isEmpty(), Place::Name, message(DetailsMessage::NoName)},
+        {shemot.n2.isEmpty(), Place::Telephone, message(DetailsMessage::NoTelephone)},
+        {shemot.n3.isEmpty() && state.MishloachHabaita, Place::Address, message(DetailsMessage::NoAddress)},
+        {shemot.ppr == notChosen, Place::Size, state.wording(u"לא בחרת גודל נייר", u"Please choose a paper size")},
+        {shemot.maat == notChosen, Place::Kind,
+         state.wording(u"לא בחר סוג נייר  מט או מבריק", u"Please choose a paper kind, matte or glossy")},
+        {shemot.Bord.isEmpty(), Place::Border, state.wording(u"לא בחרת סוג מסגרת", u"Please choose a border")},
+    };
+    for (const auto& check : checks) {
+        if (check.missing)
+            return DetailsProblem{check.message, check.place};
+    }
     return std::nullopt;
 }
 

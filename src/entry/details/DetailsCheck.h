@@ -2,16 +2,24 @@
 
 #include <QString>
 
-#include <array>
 #include <optional>
 
 namespace lumora {
 
+struct OrderDetails;
 struct SessionState;
 
-// The seven messages of the details page, by their numbers.
-using DetailsMessages = std::array<QString, 7>;
-DetailsMessages detailsMessages(bool english);
+// The messages of the details page, in the order of their numbers.
+enum class DetailsMessage {
+    NothingStored,
+    NameBeforeOptions,
+    AddressBeforeOptions,
+    NoName,
+    NoAddress,
+    DigitsOnly, // for a lab that wants telephones of digits alone; no check asks for it
+    NoTelephone,
+};
+QString detailsMessage(DetailsMessage message, bool english);
 
 // What a check found: what to say, and where the customer sets it right.
 struct DetailsProblem {
@@ -20,12 +28,11 @@ struct DetailsProblem {
     Place place;
 };
 
-// Takes every telephone, since customers add names and extensions; the message for digits only is kept for a lab that
-// wants it.
+// True for every telephone, since customers add names and extensions.
 bool IsPhoneOk(const QString& telephone);
 
 // The details as typed, into the record, trimmed.
-void takeDetails(SessionState& state, const QString& name, const QString& telephone, const QString& address);
+void takeDetails(OrderDetails& shemot, const QString& name, const QString& telephone, const QString& address);
 
 // Before the options: a name, and an address for a home delivery.
 std::optional<DetailsProblem> checkTyped(const SessionState& state, const QString& name, const QString& address);

@@ -41,6 +41,13 @@ std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunat
     return visible;
 }
 
+OrderKind orderKindOf(int tile) {
+    using enum OrderKind;
+    static constexpr std::array<OrderKind, TileCount> kinds = {Print,     EditedPrint, Sequence, NotChosen, Mail,
+                                                               NotChosen, Album,       Restart,  NotChosen, Other};
+    return tile >= 0 && tile < TileCount ? kinds[static_cast<std::size_t>(tile)] : NotChosen;
+}
+
 QString borderCode(int index) {
     static constexpr std::array<const char*, 10> codes = {"NB", "B7",  "BB1", "BB2", "CA1",
                                                           "BB", "CA9", "BL1", "FA9", "WB"};

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "session/SessionState.h"
+
 #include <QString>
 
 #include <array>
@@ -24,6 +26,9 @@ enum TileIndex {
 // Which tiles a client sees, by its letter; a letter that is not known has all the ordinary tiles. Then the switches:
 // TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away.
 std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar);
+
+// The kind of order that the tile begins, or the mode that it leaves in Optint; NotChosen for the others.
+OrderKind orderKindOf(int tile);
 
 // The border code of Image13(i), two or three letters; empty for an index out of range.
 QString borderCode(int index);

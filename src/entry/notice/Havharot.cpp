@@ -2,42 +2,45 @@
 
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
+#include "session/CaptionTexts.h"
 #include "session/PageChain.h"
-#include "session/SessionState.h"
 
 namespace lumora {
 
 Havharot::Havharot(SessionState& state, const Platform& platform, PageChain& chain)
-    : Page(PageId::Havharot)
+    : Page(pageId)
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain) {}
 
 void Havharot::setTexts() {
-    const SessionState& s = m_state;
-    Command2.visible = !m_plain;
-    Command3.visible = !m_plain;
-    Command4.visible = !m_plain;
-    if (m_plain) {
-        Title.text = s.wording(u"שירותים נוספים"_qs, u"More services"_qs);
-        Label1.text = s.wording(u"בתחנה זו אין עדיין שירותים נוספים."_qs,
-                                u"There are no further services at this station yet."_qs);
-        Command1.text = s.wording(u"חזור"_qs, u"Back"_qs);
-    } else {
-        Title.text = s.wording(u"הבהרות ואזהרות"_qs, u"Clarifications and warnings"_qs);
-        Label1.text = s.wording(u"התמונות שלכם נקראות בלבד ואינן משתנות.\n"
-                                u"הזמנה שלא נשלחה נשארת במחשב זה עד שתישלח.\n"
-                                u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.\n"
-                                u"למשלוח תמונות בדואר דרושה תוכנת דואר מוגדרת."_qs,
-                                u"Your pictures are only read and never changed.\n"
-                                u"An order that was not sent stays on this computer until it is.\n"
-                                u"Do not pull out a memory card while an order is being prepared.\n"
-                                u"Sending pictures by mail needs a mail program that is set up."_qs);
-        Command1.text = s.wording(u"המשך"_qs, u"Go on"_qs);
-    }
-    Command2.text = s.wording(u"יציאה"_qs, u"Exit"_qs);
-    Command3.text = s.wording(u"בדוק תוכנת דואר"_qs, u"Check the mail program"_qs);
-    Command4.text = s.wording(u"הגדר תוכנת דואר"_qs, u"Set up the mail program"_qs);
+    Command2.visible = Command3.visible = Command4.visible = !m_plain;
+    if (m_plain)
+        setCaptions(m_state, {
+                                 {Title, u"שירותים נוספים", u"More services"},
+                                 {Label1, u"בתחנה זו אין עדיין שירותים נוספים.",
+                                  u"There are no further services at this station yet."},
+                                 {Command1, u"חזור", u"Back"},
+                             });
+    else
+        setCaptions(m_state, {
+                                 {Title, u"הבהרות ואזהרות", u"Clarifications and warnings"},
+                                 {Label1,
+                                  u"התמונות שלכם נקראות בלבד ואינן משתנות.\n"
+                                  u"הזמנה שלא נשלחה נשארת במחשב זה עד שתישלח.\n"
+                                  u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.\n"
+                                  u"למשלוח תמונות בדואר דרושה תוכנת דואר מוגדרת.",
+                                  u"Your pictures are only read and never changed.\n"
+                                  u"An order that was not sent stays on this computer until it is.\n"
+                                  u"Do not pull out a memory card while an order is being prepared.\n"
+                                  u"Sending pictures by mail needs a mail program that is set up."},
+                                 {Command1, u"המשך", u"Go on"},
+                             });
+    setCaptions(m_state, {
+                             {Command2, u"יציאה", u"Exit"},
+                             {Command3, u"בדוק תוכנת דואר", u"Check the mail program"},
+                             {Command4, u"הגדר תוכנת דואר", u"Set up the mail program"},
+                         });
     Q_EMIT changed();
 }
 
@@ -46,22 +49,22 @@ void Havharot::showPlain() {
     setTexts();
 }
 
-void Havharot::Command1_Click() {
-    m_chain.unload(PageId::Havharot);
+void Havharot::goOn() {
+    m_chain.unload(pageId);
 }
 
-void Havharot::Command2_Click() {
+void Havharot::endProgram() {
     m_chain.endProgram();
 }
 
-void Havharot::Command3_Click() {
+void Havharot::openMailProgram() {
     m_platform.shell.openWebPage(QStringLiteral("mailto:"));
 }
 
-void Havharot::Command4_Click() {
+void Havharot::tellHowToSetUpMail() {
     m_platform.dialogs.message(m_state.wording(
-        u"פתחו את הגדרות המערכת, בחרו יישומי ברירת מחדל,\nוקבעו שם את תוכנת הדואר."_qs,
-        u"Open the system settings, choose the default applications,\nand set the mail program there."_qs));
+        u"פתחו את הגדרות המערכת, בחרו יישומי ברירת מחדל,\nוקבעו שם את תוכנת הדואר.",
+        u"Open the system settings, choose the default applications,\nand set the mail program there."));
 }
 
 } // namespace lumora

@@ -9,9 +9,18 @@ namespace lumora {
 class PageChain;
 struct SessionState;
 
-// Clarifications and warnings: a notice that the details page shows by a button of its own, and that gives way to it
-// again.
-class Havharot : public Page {
+struct HavharotControls : Controls {
+    Caption Title{*this, u"Title"};
+    Caption Label1{*this, u"Label1"}; // the notice
+    Caption Command1{*this, u"Command1"};
+    Caption Command2{*this, u"Command2"};
+    Caption Command3{*this, u"Command3"};
+    Caption Command4{*this, u"Command4"};
+};
+
+// Clarifications and warnings: a notice that the customer opens from the menu of the details page, reads, and leaves
+// for that page again.
+class Havharot : public Page, private HavharotControls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::Havharot;
@@ -25,21 +34,21 @@ public:
 
     // --- events ---
 
-    void Command1_Click(); // go on
-    void Command2_Click(); // leave the program
-    void Command3_Click(); // opens the mail program, so that the customer sees whether it is set up
-    void Command4_Click(); // how to set it up
+    void Command1_Click() { goOn(); }
+    void Command2_Click() { endProgram(); }
+    void Command3_Click() { openMailProgram(); } // so that the customer sees whether it is set up
+    void Command4_Click() { tellHowToSetUpMail(); }
 
     // --- state ---
 
-    Caption Title;
-    Caption Label1; // the notice
-    Caption Command1;
-    Caption Command2;
-    Caption Command3;
-    Caption Command4;
+    const HavharotControls& controls() const override { return *this; }
 
 private:
+    void goOn();
+    void endProgram();
+    void openMailProgram();
+    void tellHowToSetUpMail();
+
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;

@@ -36,6 +36,7 @@ private:
     void makeBars();
     void placeTiles();
 
+    const nnnControls& m_shown;
     std::unique_ptr<Album> m_album;
     QStackedLayout* m_steps;
     std::array<Tile*, 10> m_tiles{};
@@ -47,12 +48,8 @@ private:
     QPushButton* m_back = nullptr;
     QComboBox* m_moreSizes = nullptr;
     BorderSample* m_sample = nullptr;
-    QLabel* m_sampleName = nullptr;
     QFrame* m_hint = nullptr;
-    QLabel* m_termsHead = nullptr;
     QLabel* m_chosen = nullptr;
-    QLabel* m_chosenHead = nullptr;
-    QLabel* m_choiceStatus = nullptr;
     Overlay* m_clean = nullptr;
     nnn::Step m_shownStep = nnn::Step::Menu;
     int m_focusRequest = 0;

@@ -17,9 +17,9 @@ class nnnView::Album : private Maker {
 public:
     explicit Album(nnnView& view);
 
-    // All panels, one of them seen.
+    // Holds all panels and shows one.
     QWidget* widget() const { return m_widget; }
-    // The buttons that lead on, one a panel.
+    // The buttons that lead to the next panel, one for each panel.
     QList<QPushButton*> mainButtons() const { return m_mainButtons; }
     QWidget* firstFocus() const;
     void render();
@@ -30,17 +30,18 @@ private:
     QWidget* makeParents();
     QWidget* makeExtras();
     QWidget* makeBill();
-    ChoiceCards* cards(const QString& name, const AlbumPanels::Choice& choice, int columns,
-                       const QList<AlbumDrawing>& drawings, QSize size, void (AlbumPanels::*taken)(int));
-    QCheckBox* checkBox(const QString& name, const CheckCaption& caption, void (AlbumPanels::*clicked)(bool));
+    ChoiceCards* cards(const ComboCaption& choice, int columns, const QList<AlbumDrawing>& drawings, QSize size,
+                       void (AlbumPanels::*taken)(int));
+    QCheckBox* checkBox(const CheckCaption& caption, void (AlbumPanels::*clicked)(bool));
     template <class... Values>
     auto toAlbum(void (AlbumPanels::*handler)(Values...)) const {
         return [&album = m_album, handler](Values... values) { (album.*handler)(values...); };
     }
-    void addNext(const QString& name, const Caption& caption, void (AlbumPanels::*pressed)());
+    void addNext(const Caption& caption, void (AlbumPanels::*pressed)());
 
     nnnView& m_view;
     AlbumPanels& m_album;
+    const AlbumControls& m_shown;
     const Theme& m_theme;
     QWidget* m_widget;
     QStackedLayout* m_panels;
@@ -57,7 +58,7 @@ private:
     QLabel* m_billExtras = nullptr;
     QLabel* m_billParents = nullptr;
     QList<QPushButton*> m_mainButtons;
-    AlbumPanels::Panel m_shown = AlbumPanels::Panel::Photographer;
+    AlbumPanels::Panel m_shownPanel = AlbumPanels::Panel::Photographer;
 };
 
 } // namespace lumora

@@ -1,0 +1,149 @@
+#include "entry/details/nnn.h"
+
+#include "common/DrivePathText.h"
+#include "entry/details/TileMenu.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+// The steps of the page: their order, their titles and what each shows.
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+struct nnn::StepRow {
+    Step step;
+    bool asked; // on the way of this order of prints
+    const char16_t* hebrew;
+    const char16_t* english;
+    std::vector<Caption*> parts; // seen on this step alone
+};
+
+std::vector<nnn::StepRow> nnn::stepTable() {
+    const bool prints = m_state.Optint == OrderKind::Print || m_state.Optint == OrderKind::Sequence;
+    std::vector<StepRow> table = {
+        {Step::Menu, false, u"מה תרצו להזמין?", u"What would you like to order?", {&Command15}},
+        {Step::Details,
+         true,
+         u"הפרטים שלכם",
+         u"Your details",
+         {&LabelText2, &Text2, &LabelText3, &Text3, &Check2, &Command10, &Command12}},
+        {Step::Options,
+         true,
+         u"גודל וסוג נייר",
+         u"Paper size and kind",
+         {&Frame4, &LabelSizes, &LabelKinds, &Combo1, &Option3[0], &Option3[1]}},
+        {Step::Border, prints && m_state.GvulMuzag == 1, u"בחרו מסגרת", u"Choose a border", {&Picture4}},
+        {Step::Fit,
+         prints && m_state.FitMuzag,
+         u"התאמה או מילוי",
+         u"Fit or fill",
+         {&Picture5, &Option4, &Option5, &Label2, &Label3}},
+        {Step::Terms, true, u"תנאי שימוש", u"Terms of use", {&Check1, &Command29, &Image4, &Label8, &Command3}},
+        {Step::Album, false, u"", u"", {}}, // the open panel has its own title
+    };
+    for (CheckCaption& border : Image13)
+        table[static_cast<std::size_t>(Step::Border)].parts.push_back(&border);
+    return table;
+}
+
+void nnn::open(Step next) {
+    m_step = next;
+    showStep();
+}
+
+// To the next step that the order asks for. What is passed over takes its default.
+void nnn::goOnFrom(Step from) {
+    for (const StepRow& row : stepTable()) {
+        if (row.step <= from)
+            continue;
+        if (row.asked)
+            return open(row.step);
+        if (row.step == Step::Border)
+            m_state.shemot.Bord = borderCode(0);
+        if (row.step == Step::Fit)
+            m_state.shemot.FillFit = u"FIL"_s;
+    }
+}
+
+void nnn::goBack() {
+    Command12.enabled = true;
+    if (m_step == Step::Album) {
+        if (!m_album.back())
+            cancel();
+        return;
+    }
+    Step before = Step::Menu;
+    for (const StepRow& row : stepTable()) {
+        if (row.step < m_step && row.asked)
+            before = row.step;
+    }
+    open(before);
+}
+
+void nnn::showStep() {
+    const std::vector<StepRow> table = stepTable();
+    for (const StepRow& row : table) {
+        for (Caption* part : row.parts) {
+            part->visible = row.step == m_step;
+            if (row.step == Step::Terms)
+                part->enabled = part->visible;
+        }
+    }
+    const bool menu = m_step == Step::Menu;
+    const bool options = m_step == Step::Options;
+    const auto tiles = visibleTiles(m_state.profile.ClientLetter, m_state.TmunatPaar, m_state.MinuyPaar);
+    for (std::size_t i = 0; i < Image1.size(); ++i)
+        Image1[i].visible = menu && tiles[i];
+    Command14.visible = menu && m_state.MinuyPaar != 2;
+    Command2.visible = Command4.visible = !menu;
+    Command7.visible = Command9.visible = Frame1.visible;
+    LabelText4.visible = Text4.visible = m_step == Step::Details && m_state.MishloachHabaita;
+    for (CheckCaption& size : Option1)
+        size.visible = options && !size.text.isEmpty();
+    Command8.visible = options && (Option3[0].checked || Option3[1].checked);
+    Command8.enabled = m_state.shemot.ppr != notChosen;
+    Command6.visible = m_step == Step::Border && Picture16 >= 0;
+    LabelPicture16.text = Picture16 >= 0 ? Image13[static_cast<std::size_t>(Picture16)].text
+                                         : m_state.wording(u"עדיין לא נבחרה מסגרת", u"No border chosen yet");
+    LabelTerms.visible = Command30.visible = m_step == Step::Terms && m_termsHint;
+    Label4Tel.text = m_state.profile.LabPhone;
+    showProgress(table);
+    Q_EMIT changed();
+}
+
+void nnn::showProgress(const std::vector<StepRow>& table) {
+    const AlbumControls& album = m_album.controls();
+    const bool ofAlbum = m_step == Step::Album;
+    const auto asked = [&](Step last) {
+        return std::count_if(table.begin(), table.end(),
+                             [&](const StepRow& row) { return row.asked && row.step <= last; });
+    };
+    StepLine.visible = m_step != Step::Menu;
+    StepLine.text = m_state.wording(u"שלב %1 מתוך %2", u"Step %1 of %2")
+                        .arg(ofAlbum ? 1 + static_cast<int>(m_album.panel()) : asked(m_step))
+                        .arg(ofAlbum ? AlbumPanels::panelCount : asked(Step::Terms));
+    const StepRow& row = table[static_cast<std::size_t>(m_step)];
+    Title.text = ofAlbum ? album.Pic4Alboom.text.trimmed() : m_state.wording(row.hebrew, row.english);
+    Choice.text = ofAlbum ? album.ChoiceSoFar.text : choiceSoFar();
+    // The terms show the choice in a card of their own.
+    Choice.visible = ofAlbum ? album.ChoiceSoFar.visible : !Choice.text.isEmpty() && m_step != Step::Terms;
+}
+
+QString nnn::choiceSoFar() const {
+    QStringList choice;
+    if (m_step == Step::Menu || m_step == Step::Details)
+        return {};
+    if (m_state.shemot.ppr != notChosen)
+        choice += m_state.shemot.ppr;
+    if (m_state.shemot.maat != notChosen)
+        choice += m_state.shemot.maat;
+    if (Picture16 >= 0)
+        choice += Image13[static_cast<std::size_t>(Picture16)].text;
+    if (m_step == Step::Terms && (Option4.checked || Option5.checked))
+        choice += Option4.checked ? Option4.text : Option5.text;
+    return choice.join(u" · "_s);
+}
+
+} // namespace lumora

@@ -1,0 +1,48 @@
+#include "entry/details/nnn.h"
+
+#include "entry/details/DetailStore.h"
+#include "entry/details/TileMenu.h"
+#include "session/SessionState.h"
+
+// Called by nothing: the quick order by a name alone and the orders by a coupon, to which no control leads yet.
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+// The customer leaves a name or a number in the one box of the quick form: it stands for both.
+void nnn::QuickCheck() {
+    if (m_leaving || !nameGiven())
+        return;
+    OrderDetails& shemot = m_state.shemot;
+    shemot.n1 = Text2.text.trimmed();
+    shemot.n2 = Text2.text.trimmed();
+    shemot.ppr = u"10/15"_s;
+    shemot.maat = u"מבריק"_s;
+    shemot.Bord = borderCode(0);
+    shemot.FillFit = u"FIT"_s;
+    if (!Check2.checked)
+        succeeded(DetailStore(m_state, m_platform.files).forgetQuickDetails());
+    m_state.Optint = OrderKind::EditedPrint;
+    GoToSelection();
+}
+
+void nnn::CouponOrder(Coupon coupon) {
+    m_state.coupon.SmallCount = coupon == Coupon::Small ? 220 : 350;
+    m_state.coupon.LargeCount = coupon == Coupon::Small ? 3 : 5;
+    Option1[0].text = u"10/15"_s;
+    Option1[1].text = u"20/30"_s;
+    if (termsAgreed(Check1))
+        nameGiven();
+    Q_EMIT changed();
+}
+
+bool nnn::nameGiven() {
+    const bool given = !Text2.text.isEmpty();
+    if (!given)
+        tell(u"אחד או יותר מהפרטים חסרים בדוק שוב בבקשה",
+             u"One or more of the details are missing, please check again");
+    return given;
+}
+
+} // namespace lumora
