@@ -22,7 +22,7 @@ std::optional<AlbumProblem> CheckAlbum(const SessionState& state, const QString&
 // On the panel of the kind: copies for the parents need a kind of album and a size. The message, when one is missing.
 std::optional<QString> checkParentAlbum(const SessionState& state, int copies, bool chosen);
 
-// What a checked album leaves in the record, over anything that an earlier order left there.
+// Writes a checked album into the order's record, over what an earlier order left there.
 void takeAlbumOrder(SessionState& state);
 
 } // namespace lumora

@@ -16,7 +16,7 @@ enum class AlbumChoice {
     SpecialExtra, // Check3
 };
 
-// What stands in the list before anything is chosen.
+// The text of the list before a row is taken.
 QString albumPrompt(AlbumChoice choice, bool english);
 QStringList albumItems(AlbumChoice choice, bool english);
 

@@ -27,8 +27,8 @@ AlbumPanels::AlbumPanels(SessionState& state, const Platform& platform, Controls
     : AlbumControls(of)
     , m_state(state)
     , m_platform(platform)
-    , Timer4Alboom(slidePace, [this] { Timer4Alboom_Tick(); })
-    , Timer7(slidePace, [this] { Timer7_Tick(); }) {
+    , Timer4Alboom(slidePace, [this] { slide(parentsShift, Timer4Alboom); })
+    , Timer7(slidePace, [this] { slide(panelShift, Timer7); }) {
     Label17.text = notChosen;
     Label32.text = u"0"_s;
 }
@@ -113,7 +113,7 @@ void AlbumPanels::leavePhotographer() {
     if (Check5.checked) {
         const Result<void> saved =
             DetailStore(m_state, m_platform.files).SaveAlbumDetails({Text1[0].text, Text1[1].text, Text1[3].text});
-        // A memory that can't be kept holds up no order.
+        // The order goes on even if the details can't be stored.
         if (!saved)
             m_platform.dialogs.message(saved.failure().message);
     }
@@ -216,7 +216,7 @@ void AlbumPanels::finish() {
     Q_EMIT checked();
 }
 
-// All fields of the panels into the session, and from there onto the bill.
+// Copies all fields of the panels into the session and writes the bill from them.
 void AlbumPanels::gather() {
     AlbumDetails album; // of an album before nothing stays
     album.ShemZalam = Text1[0].text.trimmed();
@@ -237,14 +237,14 @@ void AlbumPanels::gather() {
     Q_EMIT changed();
 }
 
-// Who types the whole address into the first box means no other.
+// A whole address in the first box is taken as it is while no domain was chosen.
 QString AlbumPanels::mailAddress() const {
     const QString name = Text1[3].text.trimmed();
     const QString domain = Combo4Mail.text.trimmed();
     return name.contains(u'@') && domain == mailDomainPrompt(english()) ? name : name + u'@' + domain;
 }
 
-// The panel on which the fault is set right comes forward.
+// Opens the panel on which the photographer sets the fault right.
 void AlbumPanels::refuse(const AlbumProblem& problem) {
     using Place = AlbumProblem::Place;
     static const struct {

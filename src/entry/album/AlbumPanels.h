@@ -69,7 +69,7 @@ public:
 Q_SIGNALS:
     void changed();
     void focusWanted(const QString& control);
-    // The album holds together and stands in the session.
+    // The album passed its check and stands in the session.
     void checked();
 
 private:

@@ -92,7 +92,7 @@ void AlbumPanels::setTexts() {
         Combo4Mail.text = mailDomainPrompt(english());
     if (!Combo4Horim.taken())
         Combo4Horim.text = promptOf(AlbumChoice::ParentSize);
-    // What was taken stays taken.
+    // A row that was taken stays taken in the other language.
     for (const ListRow& row : listTable()) {
         const int taken = row.list.rows.currentIndex();
         row.list.fill(row.list.rows.isEmpty() ? QStringList() : itemsOf(row.choice), promptOf(row.choice));

@@ -75,7 +75,7 @@ QString DetailStore::path(const QString& name) const {
     return JoinDrivePath(WorkspacePaths::root(m_state), name);
 }
 
-// By line ends alone: a name may hold a single quote mark, as Hebrew abbreviations do.
+// Splits at line ends alone, since a name may hold a single quote mark, as Hebrew abbreviations do.
 Result<std::optional<QStringList>> DetailStore::lines(const QString& name) const {
     if (!m_files.fileExists(path(name)))
         return std::optional<QStringList>();

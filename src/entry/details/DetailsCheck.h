@@ -31,13 +31,13 @@ struct DetailsProblem {
 // True for every telephone, since customers add names and extensions.
 bool IsPhoneOk(const QString& telephone);
 
-// The details as typed, into the record, trimmed.
+// Writes the details as typed, trimmed, into the record.
 void takeDetails(OrderDetails& shemot, const QString& name, const QString& telephone, const QString& address);
 
-// Before the options: a name, and an address for a home delivery.
+// The check before the options: a name, and an address for a home delivery.
 std::optional<DetailsProblem> checkTyped(const SessionState& state, const QString& name, const QString& address);
 
-// The record of a normal order, in the order of the page; the first fault found.
+// Checks the record of a normal order in the order of the page and gives the first fault.
 std::optional<DetailsProblem> CheckDetails(const SessionState& state);
 
 } // namespace lumora

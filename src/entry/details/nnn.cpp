@@ -93,7 +93,7 @@ void nnn::takeTile(int tile) {
     Q_EMIT changed();
 }
 
-// What every tile does first. False when the workspace could not be made, which the customer has been told then.
+// Does what all tiles have in common. False when the workspace could not be made; the customer has been told.
 bool nnn::beginOrder() {
     fillSizes();
     if (const Result<QString> serial = ReadVolumeSerial(m_platform.volume, m_state.DiskRoot))
@@ -102,7 +102,7 @@ bool nnn::beginOrder() {
         m_platform.dialogs.message(u"Error getting volume information."_s);
     m_state.shemot.ser = volumeMark(VolumeSerial);
     m_state.shemot.TimeOfJob = BuildTimeOfJob(m_platform.clock.now().date(), m_state.KodMishloach, m_state.shemot.ser);
-    // What a resend left must not reach a new order.
+    // A new order must not take over the flags of a resend.
     m_state.transfer.HazmanaP = 0;
     m_state.transfer.Mefurak = Travel::Whole;
     m_state.transfer.MailFlag = 0;
@@ -211,7 +211,7 @@ void nnn::leaveDetails() {
     saveDetails();
 }
 
-// A memory that can't be kept holds up no order.
+// The order goes on even if the details can't be stored.
 void nnn::saveDetails() {
     succeeded(DetailStore(m_state, m_platform.files).SaveDetails({Text2.text, Text3.text}));
 }
@@ -267,7 +267,7 @@ void nnn::takePaperKind(int index) {
     goOnFrom(Step::Options);
 }
 
-// On with the kind that was taken before.
+// Goes on with the paper kind that was taken before.
 void nnn::keepPaperKind() {
     for (int i = 0; within(Option3, i); ++i) {
         if (Option3[static_cast<std::size_t>(i)].checked)
@@ -330,7 +330,7 @@ void nnn::finishAlbum() {
         GoToSelection();
 }
 
-// A failed check opens the step on which the customer sets it right.
+// Opens the step on which the customer sets the fault right.
 void nnn::refuse(const DetailsProblem& problem) {
     using Place = DetailsProblem::Place;
     m_platform.dialogs.message(problem.message);
@@ -356,7 +356,7 @@ void nnn::refuse(const DetailsProblem& problem) {
         open(Step::Border);
         break;
     }
-    // Whoever is sent back to the details must get on again from there.
+    // Details taken from memory have switched the button off.
     Command12.enabled = true;
     Q_EMIT changed();
 }

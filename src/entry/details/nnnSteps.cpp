@@ -53,7 +53,7 @@ void nnn::open(Step next) {
     showStep();
 }
 
-// To the next step that the order asks for. What is passed over takes its default.
+// Opens the next step that the order asks for. A step that is passed over takes its default.
 void nnn::goOnFrom(Step from) {
     for (const StepRow& row : stepTable()) {
         if (row.step <= from)

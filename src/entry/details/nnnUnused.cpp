@@ -10,7 +10,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-// The customer leaves a name or a number in the one box of the quick form: it stands for both.
+// The quick form has one box; its text is both name and telephone.
 void nnn::QuickCheck() {
     if (m_leaving || !nameGiven())
         return;

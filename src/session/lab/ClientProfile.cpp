@@ -8,7 +8,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Entries from the first one without a default on keep what they hold.
+// Entries behind the first withDefault keep what they hold unless they are given.
 template <std::size_t N>
 void setSizes(std::array<QString, N>& sizes, const std::array<QString, N>& given, std::size_t withDefault) {
     for (std::size_t i = 0; i < N; ++i) {
@@ -29,10 +29,10 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     if (profile.PriceListUrl.isEmpty())
         profile.PriceListUrl = profile.SiteUrl + u"album_pricelist"_s;
     profile.PriceListUrl2 = profile.PriceListUrl;
-    // The site's address ends in a slash already: two slashes in a row are how these addresses read.
+    // The site's address ends in a slash; these addresses have two slashes in a row.
     profile.AdUrl1 = profile.SiteUrl + u"/ad01.jpg"_s;
     profile.AdUrl2 = profile.SiteUrl + u"/ad02.jpg"_s;
-    // Without "2000" in front, unlike the workspace: an installation places these pictures.
+    // The installation places these pictures in a folder without "2000" in front, unlike the workspace.
     profile.AdFile1 = state.DiskRoot + u"lumora\\zmany\\ad01.jpg"_s;
     profile.AdFile2 = state.DiskRoot + u"lumora\\zmany\\ad02.jpg"_s;
     state.profile = std::move(profile);
@@ -49,7 +49,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.coupon.HaKoopon = deployment.HaKoopon;
-    // With a limit of nothing a lab that takes coupons would get no order at all.
+    // A limit of 0 would refuse every order of a lab that takes coupons.
     state.coupon.SmallCount = deployment.HaKoopon == 1 ? 220 : 0;
     state.coupon.LargeCount = deployment.HaKoopon == 1 ? 3 : 0;
 }

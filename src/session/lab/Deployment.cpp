@@ -4,7 +4,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-// Addresses of the kinds kept free for examples: a program without a lab's file reaches nobody.
+// The addresses are reserved for examples, so that a program without a lab's file reaches no server.
 Deployment::Deployment() {
     profile.FtpFolder2 = u"zalamim234"_s;
     profile.ClientCode = u"tarvelmond"_s;

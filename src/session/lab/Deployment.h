@@ -9,8 +9,8 @@ namespace lumora {
 struct Deployment {
     Deployment();
 
-    // Folders of the advertising pictures follow the drive root, which is known at run time: AdFile1 and AdFile2 stay
-    // empty here. AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
+    // AdFile1 and AdFile2 stay empty here, since their folder follows the drive root, which is known at run time.
+    // AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
     ClientProfile profile;
 
     Sender SugSheliach = Sender::Ftp;
