@@ -6,18 +6,72 @@
 #include "session/TextList.h"
 #include "session/Ticker.h"
 #include "session/lab/Deployment.h"
-
-#include <array>
+#include "start/StartMotion.h"
 
 namespace lumora {
 
 class PageChain;
 struct SessionState;
 
-// The start page: greets the customer, starts an order, shows the way to the price list and the site, switches the
-// language, and can ask at which shop the prints are fetched. Every load begins in Hebrew with the profile of the
-// deployment.
-class hatchala : public Page {
+struct hatchalaControls : Controls {
+    Caption Title{*this, u"Title"};                            // the page's greeting
+    Caption Notice{*this, u"Notice", Caption::At::Hidden};     // left by the page before: the number of a kept order
+    Caption Image1{*this, u"Image1"};                          // start
+    Caption Image11{*this, u"Image11"};                        // price list
+    Caption Image5{*this, u"Image5"};                          // site
+    Caption Image8{*this, u"Image8"};                          // the site's own name
+    Caption Image6{*this, u"Image6"};                          // how to reach the lab
+    Caption Image3{*this, u"Image3"};                          // exit
+    CheckCaption Check1{*this, u"Check1"};                     // "English Tips"
+    Caption Label1{*this, u"Label1"};                          // the lab's mail address
+    Caption Label4Tel{*this, u"Label4Tel"};                    // the lab's telephone
+    Caption Label4Tel2{*this, u"Label4Tel2"};                  // the same
+    Caption Label4Zel{*this, u"Label4Zel"};                    // the shadow of Label4Tel
+    Caption Label3{*this, u"Label3", Caption::At::Hidden};     // in English, what the button for the site does
+    Caption Label4{*this, u"Label4", Caption::At::Hidden};     // in English, what the exit does
+    Caption Label6{*this, u"Label6", Caption::At::Hidden};     // the countdown's seconds
+    Caption Label7{*this, u"Label7", Caption::At::Hidden};     // the countdown's text
+    Caption Label8{*this, u"Label8"};                          // the arrow that moves above the start button
+    Caption Label4How{*this, u"Label4How"};                    // the way to prints,
+    ControlArray<Caption, 3> Label4Step{*this, u"Label4Step"}; // and its steps
+    Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // the panel that asks for the shop
+    Caption List1Caption{*this, u"List1Caption"};              // what is asked
+    TextList List1{*this, u"List1"};                           // where the prints are fetched; row 0 is the first shop
+    Caption shopsBack{*this, u"shopsBack"};                    // puts the question off
+    Caption Picture2{*this, u"Picture2"};                      // decoration that gives way to a help picture
+    Caption Image2{*this, u"Image2"};                          // the same
+    Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
+    ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
+    QString Picture4; // drive path of the advertising picture; empty when there is none
+
+    // Seen by nobody: two buttons that code presses, and the service panel with the settings as one line of text.
+    Caption Command1{*this, u"Command1", Caption::At::Hidden};
+    Caption Command2{*this, u"Command2", Caption::At::Hidden};
+    Caption Picture8{*this, u"Picture8", Caption::At::Hidden};
+    Caption Command3{*this, u"Command3"};
+    Caption Command4{*this, u"Command4"};
+    Caption Command5{*this, u"Command5"};
+    Caption Command6{*this, u"Command6"};
+    Caption Command7{*this, u"Command7"}; // without effect
+    Caption Command8{*this, u"Command8"};
+    Caption Command9{*this, u"Command9"}; // without effect
+    Caption Label5{*this, u"Label5"};     // the settings text
+    TextList List2{*this, u"List2"};      // lines of the settings file
+    TextList List4pices{*this, u"List4pices"};
+};
+
+struct hatchalaTimers {
+    Ticker Timer1; // fetches the advertising picture, once; no step starts it
+    Ticker Timer2; // moves the advertising picture
+    Ticker Timer3; // opens the panel
+    Ticker Timer4; // countdown to the automatic start; no step starts it
+    Ticker Timer5; // moves the arrow
+};
+
+// The start page (hatchala, "beginning"): greets the customer, who begins an order here, goes to the price list or the
+// lab's site, turns the language, and says at which shop the prints are fetched where the lab asks for it. Each load
+// begins in Hebrew with the profile of the deployment.
+class hatchala : public Page, private hatchalaControls {
     Q_OBJECT
 public:
     hatchala(SessionState& state, const Platform& platform, PageChain& chain, const Deployment& deployment);
@@ -27,42 +81,38 @@ public:
 
     // --- events ---
 
-    // The start button: the press hands over; the click comes only when the page stayed, and then opens the question of
-    // the shop.
-    void Image1_MouseDown();
-    void Image1_Click();
-    void Image11_Click();            // price list on the web
-    void Image5_Click();             // the lab's site
-    void Image8_Click();             // the same, its second picture
-    void Image3_MouseDown();         // ends the program
-    void Check1_Click(bool checked); // English wording
-    void List1_Click(int row);       // the shop, also when the row is chosen already
-    void Command1_Click();
-    void Command2_Click();
-
+    // The press hands over; the click comes only when the page stayed, and then the shop is still to be chosen.
+    void Image1_MouseDown() { startWith(QStringLiteral("KUP")); }
+    void Image1_Click() { askForTheShop(); }
+    void Image11_Click() { openPriceList(); }
+    void Image5_Click() { openSite(); }
+    void Image8_Click() { openSite(); }
+    void Image3_MouseDown() { leaveProgram(); }
+    void Check1_Click(bool checked) { setEnglish(checked); }
+    void List1_Click(int row) { chooseShop(row); } // also when the row is chosen already
+    void Command2_Click() { startWithShop(); }
+    void Picture1_Escape() { putOffTheQuestion(); }
     // Where the mouse, a finger or the keyboard is; what has no help counts as the bare page.
     enum class Hover { Nothing, Image1, Image11, Image5, Image3, Image6 };
-    void MouseMove(Hover over);
-    void Picture1_Escape(); // the question of the shop is put off: the page waits as before
+    void MouseMove(Hover over) { showHelp(over); }
+    void Timer2_Tick() { movePicture(); }
+    void Timer3_Tick() { unfoldPanel(); }
+    void Timer5_Tick() { moveArrow(); }
 
-    void Timer1_Tick();
-    void Timer2_Tick();
-    void Timer3_Tick();
-    void Timer4_Tick();
-    void Timer5_Tick();
+    // No step of the page chain comes here: hatchalaUnused.cpp.
+    void Command1_Click() { showSender(); }
+    void Command3_Click() { fetchSettings(); }
+    void Command4_Click() { scramble(); }
+    void Command5_Click() { BuildSettingsText(); }
+    void Command6_Click() { unscramble(); }
+    void Command8_Click() { SplitSettingsText(Label5.text); }
+    void Timer1_Tick() { fetchPicture(); }
+    void Timer4_Tick() { countDown(); }
+    // The start by the countdown.
     void StartAutomatically();
-
-    // The service panel: settings as one line of text. No step of the page chain shows it.
-    void Command3_Click(); // "Read"
-    void Command4_Click(); // "myzofen"
-    void Command5_Click(); // "shoora"
-    void Command6_Click(); // "open zofen"
-    void Command7_Click() {}
-    void Command8_Click();
-    void Command9_Click() {}
     // Builds the settings text of the profile, writes the settings file and shows both forms of it.
     void BuildSettingsText();
-    // Fetches the remote copy to the settings file; tells nothing of a failure.
+    // Fetches the remote copy to the settings file. After a failure there is no such file.
     void DownloadSettings();
     // The lines of the settings file into List2; "No Server" for a file that is missing or is not this client's.
     void ReadSettingsFile(const QString& path);
@@ -70,80 +120,52 @@ public:
 
     // --- state ---
 
-    Caption Title;  // the page's greeting
-    Caption Notice; // a line left by the page before, such as the number of an order that stays here; hidden when there
-                    // is none
-    Caption Image1; // start
-    Caption Image11;     // price list
-    Caption Image5;      // site
-    Caption Image8;      // the site's own name
-    Caption Image6;      // how to reach the lab
-    Caption Image3;      // exit
-    CheckCaption Check1; // "English Tips"
-    Caption Label1;      // the lab's mail address
-    Caption Label4Tel;   // the lab's telephone
-    Caption Label4Tel2;
-    Caption Label4Zel; // the shadow of Label4Tel
-    Caption Label3;    // what the button for the site does, in English
-    Caption Label4;    // what the exit does, in English
-    Caption Label6;    // the countdown's number
-    Caption Label7;    // the countdown's text
-    Caption Label8;    // the arrow that moves above the start button
-    static constexpr int arrowTop = 400;
-    static constexpr int arrowBottom = 430;
-    int Label8Top = arrowTop;
-    Caption Picture1; // the panel with List1
-    static constexpr int panelWidth = 230;
-    int Picture1Width = 0; // grows to panelWidth
-    Caption List1Caption;  // what is asked
-    TextList List1;        // where the prints are fetched; row 0 is always the first shop
-    Caption Picture2;      // decoration that gives way to the help picture
-    Caption Picture3;      // the line above a help picture; in English the question of the shop
-    Caption Image2;
-    std::array<Caption, 6> Image12; // help pictures by Hover, index 0 unused
-    QString Picture4;               // drive path of the advertising picture; empty when there is none
-    static constexpr int pictureWidth = 265;
-    int Picture4Width = pictureWidth; // 4 to pictureWidth
-    Caption Command1;
-    Caption Command2;
-
-    Caption Picture8; // the service panel
-    Caption Command3;
-    Caption Command4;
-    Caption Command5;
-    Caption Command6;
-    Caption Command7;
-    Caption Command8;
-    Caption Command9;
-    Caption Label5; // the settings text
-    TextList List2; // lines of the settings file
-    TextList List4pices;
-
-    Ticker Timer1; // fetches the advertising picture, once; no step starts it
-    Ticker Timer2; // moves the advertising picture
-    Ticker Timer3; // opens the panel
-    Ticker Timer4; // countdown to the automatic start; no step starts it
-    Ticker Timer5; // moves the arrow
+    const hatchalaControls& controls() const override { return *this; }
+    Hover hover() const { return m_over; }
+    const StartMotion& motion() const { return m_motion; }
+    const hatchalaTimers& timers() const { return m_timers; }
 
 Q_SIGNALS:
-    // Label8Top, Picture1Width or Picture4Width has moved by a step: dozens of times a second, so that a view moves
-    // just that piece. The page may wait for hours.
+    // --- what it tells: changed(), and ---
+
+    // A step of motion(), dozens of times a second: a view moves just that piece, as the page may wait for hours.
     void moved();
 
 private:
+    void setHelp();
     void loadProfile();
     void showProfile();
-    void setHelp();
     void startWith(const QString& code);
+    void startWithShop();
     void handOver();
+    void askForTheShop();
+    void putOffTheQuestion();
+    void chooseShop(int row);
+    void openPriceList();
+    void openSite();
+    void leaveProgram();
+    void setEnglish(bool english);
+    void showHelp(Hover over);
+    void movePicture();
+    void unfoldPanel();
+    void moveArrow();
+
+    void showSender();
+    void fetchPicture();
+    void countDown();
+    void fetchSettings();
+    void scramble();
+    void unscramble();
     QString settingsFile() const;
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     const Deployment& m_deployment;
-    int m_pictureStep = 0; // the picture moves once it has been at a limit
+    hatchalaTimers m_timers;
+    StartMotion m_motion;
     Hover m_over = Hover::Nothing;
+    int m_secondsLeft = 5; // of the countdown
     bool m_leaving = false;
 };
 

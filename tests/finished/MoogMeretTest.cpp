@@ -63,15 +63,15 @@ protected:
         return page();
     }
     MoogMeret& startWith(const QString& order) {
-        start().List3_Click(page().List3.find(order));
+        start().List3_Click(page().controls().List3.find(order));
         return page();
     }
     MoogMeret& page() { return static_cast<MoogMeret&>(*chain.find(PageId::MoogMeret)); }
     static std::string marked(const MoogMeret& page) {
         QStringList names;
-        for (int i = 0; i < page.File1.names().count(); ++i) {
-            if (page.File1.isMarked(i))
-                names += page.File1.names().item(i);
+        for (int i = 0; i < page.files().names().size(); ++i) {
+            if (page.files().isMarked(i))
+                names += page.files().names()[i];
         }
         return names.join(u' ').toStdString();
     }
@@ -81,8 +81,8 @@ protected:
     }
     // Index and minutes of the package in hand, or "over".
     std::string walk() {
-        return page().walking()
-                   ? (QString::number(page().List1.currentIndex()) + u' ' + page().Label13.text).toStdString()
+        return page().phase() == MoogMeret::Phase::Walking
+                   ? (QString::number(page().controls().List1.currentIndex()) + u' ' + page().controls().Label13.text).toStdString()
                    : "over";
     }
 
@@ -95,10 +95,10 @@ protected:
 
 TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
     MoogMeret& page = start();
-    EXPECT_EQ(page.List3.items(), QStringList({whole, pieces}));
-    EXPECT_EQ(page.List2.items(), QStringList({orders + u'\\' + whole, orders + u'\\' + pieces}));
-    EXPECT_FALSE(page.Picture2.visible);
-    EXPECT_EQ(page.Label23.text, QString());
+    EXPECT_EQ(page.controls().List3.items(), QStringList({whole, pieces}));
+    EXPECT_EQ(page.controls().List2.items(), QStringList({orders + u'\\' + whole, orders + u'\\' + pieces}));
+    EXPECT_FALSE(page.controls().Picture2.visible);
+    EXPECT_EQ(page.controls().Label23.text, QString());
 
     struct Case {
         QString order;
@@ -113,46 +113,46 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
         {whole, "!104_1234.jpp", 4, 0, 1}, // neither the flag nor the pattern goes back, and texts are listed too
     };
     for (const Case& c : cases) {
-        page.List3_Click(page.List3.find(c.order));
-        EXPECT_TRUE(page.Picture2.visible);
+        page.List3_Click(page.controls().List3.find(c.order));
+        EXPECT_TRUE(page.controls().Picture2.visible);
         EXPECT_EQ(state.transfer.OrderFolder, orders + u'\\' + c.order);
         EXPECT_EQ(marked(page), c.marked);
-        EXPECT_EQ(page.Label1.text, QString::number(c.files));
-        EXPECT_EQ(page.Label5.text, QString::number(c.pictures));
+        EXPECT_EQ(page.controls().Label1.text, QString::number(c.files));
+        EXPECT_EQ(page.controls().Label5.text, QString::number(c.pictures));
         EXPECT_EQ(state.shemot.TotalPics, c.pictures);
-        EXPECT_EQ(state.transfer.Mefurak, static_cast<Travel>(c.Mefurak));
-        EXPECT_EQ(page.Label4Pieces.visible, c.Mefurak > 0);
-        EXPECT_EQ(page.Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order == pieces);
+        EXPECT_EQ(state.transfer.Mefurak, c.Mefurak);
+        EXPECT_EQ(page.controls().Label4Pieces.visible, c.Mefurak > 0);
+        EXPECT_EQ(page.controls().Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order == pieces);
     }
-    EXPECT_EQ(page.Label4Lakoach.text, u"לקוח: דנה לוי 03-1234567");
+    EXPECT_EQ(page.controls().Label4Lakoach.text, u"לקוח: דנה לוי 03-1234567");
     page.File1_Click(0);
-    page.File1_Click(page.File1.names().find(whole + u".txt"_s));
-    EXPECT_EQ(page.Label5.text, u"0") << "the year in a text's name is no number of pictures";
+    page.File1_Click(page.controls().File1.find(whole + u".txt"_s));
+    EXPECT_EQ(page.controls().Label5.text, u"0") << "the year in a text's name is no number of pictures";
     page.Command21_Click();
-    EXPECT_EQ(page.File1.markedCount(), 0);
+    EXPECT_EQ(page.files().markedCount(), 0);
 }
 
 TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     const QString empty = u"2026_11_19_KUP_1234^103"_s;
     ASSERT_TRUE(test.files.makeFolder(orders + u'\\' + empty).ok());
     MoogMeret& page = startWith(empty);
-    EXPECT_EQ(page.Label1.text, u"0");
-    EXPECT_TRUE(page.Label4Reka.visible);
-    EXPECT_FALSE(page.Label4Lakoach.visible) << "no text tells whose it is";
-    EXPECT_TRUE(page.Picture1.isNull());
+    EXPECT_EQ(page.controls().Label1.text, u"0");
+    EXPECT_TRUE(page.controls().Label4Reka.visible);
+    EXPECT_FALSE(page.controls().Label4Lakoach.visible) << "no text tells whose it is";
+    EXPECT_TRUE(page.controls().Picture1.isNull());
     page.Command4_Click();
     page.Command2_Click();
     EXPECT_EQ(test.dialogs.messages, QStringList({u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"_s,
                                                   u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s}));
-    EXPECT_TRUE(page.Command4.visible && page.Command2.visible);
+    EXPECT_TRUE(page.controls().Command4.visible && page.controls().Command2.visible);
     EXPECT_EQ(chain.front(), &page);
 
     std::filesystem::remove_all(*test.drives.toHost(orders));
     page.List3_Click(1);
-    EXPECT_TRUE(test.dialogs.messages.last().contains(page.List2.item(1))) << "gone since it was listed";
+    EXPECT_TRUE(test.dialogs.messages.last().contains(page.controls().List2.item(1))) << "gone since it was listed";
     page.Command5_Click();
-    EXPECT_TRUE(page.Label4Rek.visible);
-    EXPECT_FALSE(page.Picture2.visible);
+    EXPECT_TRUE(page.controls().Label4Rek.visible);
+    EXPECT_FALSE(page.controls().Picture2.visible);
 }
 
 TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
@@ -175,23 +175,23 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
         MoogMeret& page = startWith(c.order);
         if (!c.all)
             page.Command21_Click();
-        page.File1_Click(page.File1.names().find(QString::fromLatin1(c.touched)));
-        EXPECT_EQ(leaves(page.File1.mailList()).toStdString(), c.mailed);
-        state.transfer.SugMishloah = Sending::NewOrder;
+        page.File1_Click(page.controls().File1.find(QString::fromLatin1(c.touched)));
+        EXPECT_EQ(leaves(page.files().mailList()).toStdString(), c.mailed);
+        state.transfer.SugMishloah = 0;
         page.Command4_Click();
         ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
         EXPECT_EQ(leaves(state.handOver.lines).toStdString(), c.sent.toStdString());
         EXPECT_EQ(state.handOver.lines.value(0), in(c.order, c.order + u".txt"_s));
-        EXPECT_EQ(state.transfer.SugMishloah, Sending::Resend);
+        EXPECT_EQ(state.transfer.SugMishloah, 1);
         EXPECT_EQ(chain.find(PageId::MoogMeret), nullptr);
         chain.unload(PageId::FtpFrm);
     }
     // The order's text may be marked as well, and travels once.
     MoogMeret& page = startWith(pieces);
-    page.File1_Click(page.File1.names().find(pieces + u".txt"_s));
-    EXPECT_EQ(page.File1.resendList().count(in(pieces, pieces + u".txt"_s)), 1);
+    page.File1_Click(page.controls().File1.find(pieces + u".txt"_s));
+    EXPECT_EQ(page.files().resendList().count(in(pieces, pieces + u".txt"_s)), 1);
 
-    state.transfer.SugSheliach = Sender::Http;
+    state.transfer.SugSheliach = 1;
     state.handOver.lines.clear();
     page.Command4_Click();
     EXPECT_EQ(chain.front()->id(), PageId::UploadForm);
@@ -204,11 +204,11 @@ TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
     state.shemot.n1 = u"Dana"_s;
     state.handOver.lines = {in(whole, whole)};
     MoogMeret& page = start();
-    EXPECT_EQ(page.List3.currentItem(), whole);
+    EXPECT_EQ(page.controls().List3.currentItem(), whole);
     EXPECT_EQ(marked(page), "!104_1234.jpp 02a.jpp 11b.JPG");
-    EXPECT_EQ(leaves(page.List1.items()), whole + u" !104_1234.jpp 02a.jpp 11b.JPG"_s);
+    EXPECT_EQ(leaves(page.controls().List1.items()), whole + u" !104_1234.jpp 02a.jpp 11b.JPG"_s);
     EXPECT_TRUE(state.handOver.lines.isEmpty());
-    for (const Caption* label : {&page.Label23, &page.Label20, &page.Label10, &page.Label7})
+    for (const Caption* label : {&page.controls().Label23, &page.controls().Label20, &page.controls().Label10, &page.controls().Label7})
         EXPECT_EQ(label->text, u"Dana");
 }
 
@@ -234,24 +234,24 @@ TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
     for (const Case& c : cases) {
         ASSERT_TRUE(saveJpeg(Bitmap(c.width, c.height, Qt::red), sheet, 80).ok());
         MoogMeret& page = startWith(whole);
-        EXPECT_FALSE(page.Picture1.isNull());
-        EXPECT_EQ(page.HScroll1.max, c.horizontal) << c.width;
-        EXPECT_EQ(page.VScroll1.max, c.vertical) << c.height;
+        EXPECT_FALSE(page.controls().Picture1.isNull());
+        EXPECT_EQ(page.controls().HScroll1.max, c.horizontal) << c.width;
+        EXPECT_EQ(page.controls().VScroll1.max, c.vertical) << c.height;
         page.VScroll1_Change(9999);
-        EXPECT_EQ(page.VScroll1.value, c.vertical);
+        EXPECT_EQ(page.controls().VScroll1.value, c.vertical);
     }
     page().List3_Click(1); // begins with a file that is no picture
-    EXPECT_TRUE(page().Picture1.isNull());
-    EXPECT_EQ(page().VScroll1.max + page().VScroll1.value, 0);
+    EXPECT_TRUE(page().controls().Picture1.isNull());
+    EXPECT_EQ(page().controls().VScroll1.max + page().controls().VScroll1.value, 0);
 }
 
 TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
     MoogMeret& page = startWith(whole);
     test.clock.time = at("10:00:59");
     page.Command2_Click();
-    EXPECT_FALSE(page.Command2.visible || page.Command4.visible || page.Command18.visible || page.List1Shown.visible);
-    EXPECT_TRUE(page.Label24.visible && page.Timer3.running());
-    EXPECT_EQ(page.Label4Mana.text, u"מנה 1 מתוך 3");
+    EXPECT_FALSE(page.controls().Command2.visible || page.controls().Command4.visible || page.controls().Command18.visible || page.List1Shown.visible);
+    EXPECT_TRUE(page.controls().Label24.visible && page.clockRuns());
+    EXPECT_EQ(page.controls().Label4Mana.text, u"מנה 1 מתוך 3");
 
     struct Case {
         const char* time;
@@ -267,9 +267,9 @@ TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
         tick(c.time);
         EXPECT_EQ(walk(), c.walk) << c.time;
     }
-    EXPECT_TRUE(page.Command18.visible && page.Command2.visible && page.List1Shown.visible && page.Timer3.running());
-    EXPECT_FALSE(page.Label24.visible);
-    EXPECT_EQ(page.Label4Shaa.text, u"09:50:00") << "the timer runs on";
+    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible && page.List1Shown.visible && page.clockRuns());
+    EXPECT_FALSE(page.controls().Label24.visible);
+    EXPECT_EQ(page.controls().Label4Shaa.text, u"09:50:00") << "the timer runs on";
     EXPECT_TRUE(test.mail.messages.isEmpty()) << "no mail server is set up";
 }
 
@@ -279,7 +279,7 @@ TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedTh
     page.Command2_Click();
     tick("10:03:00");
     page.Label13_Click();
-    EXPECT_EQ(page.Label13.text, u"0");
+    EXPECT_EQ(page.controls().Label13.text, u"0");
     tick("10:03:00");
     EXPECT_EQ(walk(), "0 3") << "counted from the start of the package again";
     tick("10:03:00");
@@ -287,17 +287,17 @@ TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedTh
     page.Command4_Click();
     page.List3_Click(1);
     page.Command5_Click();
-    EXPECT_EQ(page.List3.currentItem(), whole) << "nothing is picked while packages go";
+    EXPECT_EQ(page.controls().List3.currentItem(), whole) << "nothing is picked while packages go";
     page.Command19_Click();
-    EXPECT_FALSE(page.Timer3.running());
-    EXPECT_EQ(page.List1.currentIndex(), 1);
-    EXPECT_TRUE(page.Command18.visible && page.Command2.visible && page.List1Shown.visible);
+    EXPECT_FALSE(page.clockRuns());
+    EXPECT_EQ(page.controls().List1.currentIndex(), 1);
+    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible && page.List1Shown.visible);
 
     page.File1_Click(0);
     page.File1_Click(1);
     page.Command2_Click();
-    EXPECT_EQ(leaves(page.List1.items()), u"!104_1234.jpp 11b.JPG");
-    EXPECT_EQ(page.List1.currentIndex(), 0);
+    EXPECT_EQ(leaves(page.controls().List1.items()), u"!104_1234.jpp 11b.JPG");
+    EXPECT_EQ(page.controls().List1.currentIndex(), 0);
 }
 
 TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
@@ -311,32 +311,32 @@ TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     EXPECT_EQ(test.mail.messages[0].attachment, *test.drives.toHost(in(whole, u"!104_1234.jpp"_s)));
     for (const char* word : {"דנה לוי", "03-1234567", "10/15", "!104_1234.jpp", "מנה 1 מתוך 3"})
         EXPECT_TRUE(test.mail.messages[0].body.contains(QString::fromUtf8(word))) << word;
-    EXPECT_EQ(page.Label4Doar.text, MailResultText(0, false).trimmed());
+    EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(0, false).trimmed());
 
     for (const char* time : {"10:03:00", "10:03:00", "10:06:00", "10:06:00", "10:09:00", "10:09:00"})
         tick(time);
     EXPECT_EQ(walk(), "over");
     ASSERT_EQ(test.mail.messages.size(), 3);
-    EXPECT_EQ(page.package(1), MoogMeret::Package::Failed);
-    EXPECT_TRUE(page.Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
+    EXPECT_EQ(page.walk().fate(1), PackageWalk::Fate::Failed);
+    EXPECT_TRUE(page.controls().Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
     EXPECT_TRUE(test.files.fileExists(in(whole, u"02a.jpp"_s)));
 
     test.mail.outcomes = {{MailEnd::RecipientRefused, {}}};
     page.List1_Click(0);
     EXPECT_EQ(test.mail.messages.size(), 3) << "the server has it";
     page.List1_Click(1);
-    EXPECT_EQ(page.Label4Doar.text, MailResultText(14, false));
+    EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(14, false));
     page.List1_Click(1);
     EXPECT_EQ(test.mail.messages.size(), 5);
     EXPECT_EQ(test.mail.messages.last().attachment, *test.drives.toHost(in(whole, u"02a.jpp"_s)));
-    EXPECT_EQ(page.Label4Sof.text, u"כל 3 המנות נשלחו בדואר.");
+    EXPECT_EQ(page.controls().Label4Sof.text, u"כל 3 המנות נשלחו בדואר.");
 }
 
 TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
     state.profile.mail.host = u"192.0.2.25"_s;
     test.mail.onSend = [&] {
         MoogMeret& busy = page();
-        EXPECT_TRUE(busy.sending());
+        EXPECT_TRUE(busy.answer() == MoogMeret::Answer::Sending);
         tick("10:09:00");
         busy.Command2_Click();
         busy.Command13_Click();
@@ -350,17 +350,17 @@ TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
     test.clock.time = at("10:00:00");
     page.Command2_Click();
     EXPECT_EQ(test.mail.messages.size(), 1);
-    EXPECT_EQ(page.List1.currentIndex(), 0);
+    EXPECT_EQ(page.controls().List1.currentIndex(), 0);
     EXPECT_EQ(chain.front(), &page);
-    EXPECT_EQ(page.Label13.text, u"0") << "the minutes begin when the message is gone";
+    EXPECT_EQ(page.controls().Label13.text, u"0") << "the minutes begin when the message is gone";
 
     // Stopped in the middle of a message: that one is finished, and none follows.
     test.mail.onSend = [&] { this->page().Command19_Click(); };
     page.Command19_Click();
     page.Command2_Click();
-    EXPECT_FALSE(page.walking() || page.Timer3.running());
-    EXPECT_EQ(page.package(0), MoogMeret::Package::Sent);
-    EXPECT_TRUE(page.Command2.visible);
+    EXPECT_FALSE(page.phase() == MoogMeret::Phase::Walking || page.clockRuns());
+    EXPECT_EQ(page.walk().fate(0), PackageWalk::Fate::Sent);
+    EXPECT_TRUE(page.controls().Command2.visible);
 }
 
 TEST(FinishedOrderTest, TheNameOfAFolderTellsDateAndNumber) {

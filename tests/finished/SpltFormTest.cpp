@@ -37,31 +37,31 @@ TEST_F(SpltFormTest, AFolderIsCutAndItsFamiliesAreJoinedAgain) {
     write(at("2.jpp"), "abcde");
     write(at("3.jpp"), "wxyz");
     write(at("order.txt"), "not cut");
-    EXPECT_EQ(page().Text2.text, u"400000"_s);
+    EXPECT_EQ(page().controls().Text2.text, u"400000"_s);
     choose("order.txt", &SpltForm::Command2_Click);
-    EXPECT_EQ(page().List4files.items(), QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
+    EXPECT_EQ(page().controls().List4files.items(), QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
     page().Text2_Change(u"4"_s);
     page().Command3_Click();
-    EXPECT_EQ(page().outcome, SpltForm::Outcome::Good);
-    EXPECT_TRUE(page().Label4Total.text.startsWith(u"Files cut: 3, pieces: 6."_s))
-        << page().Label4Total.text.toStdString();
-    EXPECT_EQ(page().Label4Where.text, at("meforakim"));
+    EXPECT_EQ(page().phase(), SpltForm::Phase::Good);
+    EXPECT_TRUE(page().controls().Label4Total.text.startsWith(u"Files cut: 3, pieces: 6."_s))
+        << page().controls().Label4Total.text.toStdString();
+    EXPECT_EQ(page().controls().Label4Where.text, at("meforakim"));
 
     choose("meforakim\\1_jpp_001_003.prk", &SpltForm::Command8_Click);
-    EXPECT_TRUE(page().List4files.isEmpty());
-    EXPECT_EQ(page().Label1.text, u"6"_s);
-    EXPECT_EQ(page().Label5.text, u"3"_s);
-    EXPECT_EQ(page().familyWords(0), u"Complete: 3 of 3"_s);
-    EXPECT_EQ(page().familyWords(2), u"Short: 1 of 2"_s) << "an exact multiple";
+    EXPECT_TRUE(page().controls().List4files.isEmpty());
+    EXPECT_EQ(page().controls().Label1.text, u"6"_s);
+    EXPECT_EQ(page().controls().Label5.text, u"3"_s);
+    EXPECT_EQ(page().familyRow(0).words, u"Complete: 3 of 3"_s);
+    EXPECT_EQ(page().familyRow(2).words, u"Short: 1 of 2"_s) << "an exact multiple";
     page().Command1_Click();
     EXPECT_EQ(read(at("meforakim\\moorkavim\\1.jpp")), "0123456789");
     EXPECT_EQ(read(at("meforakim\\moorkavim\\2.jpp")), "abcde");
     EXPECT_FALSE(machine.files.fileExists(at("meforakim\\moorkavim\\3.jpp")));
-    EXPECT_EQ(page().outcome, SpltForm::Outcome::Partly);
-    EXPECT_EQ(page().List4Bodedim.currentIndex(), 2) << "each family is selected before it is asked";
+    EXPECT_EQ(page().phase(), SpltForm::Phase::Partly);
+    EXPECT_EQ(page().controls().List4Bodedim.currentIndex(), 2) << "each family is selected before it is asked";
     page().Command4_Click();
     EXPECT_EQ(read(at("meforakim\\moorkavim\\3.jpp")), "wxyz");
-    EXPECT_TRUE(page().Label4Total.text.contains(u"declares 2"_s));
+    EXPECT_TRUE(page().controls().Label4Total.text.contains(u"declares 2"_s));
     EXPECT_EQ(machine.dialogs.messages, QStringList());
 }
 
@@ -69,19 +69,19 @@ TEST_F(SpltFormTest, ReadingAgainAddsAndTheSameFolderTwiceIsTold) {
     write(at("a_jpp_001_001.prk"), "a");
     write(at("sub\\a_jpp_001_001.prk"), "b");
     choose("a_jpp_001_001.prk", &SpltForm::Command8_Click);
-    EXPECT_EQ(page().Label1.text, u"2"_s);
-    EXPECT_EQ(page().Label5.text, u"2"_s) << "two folders, two families";
+    EXPECT_EQ(page().controls().Label1.text, u"2"_s);
+    EXPECT_EQ(page().controls().Label5.text, u"2"_s) << "two folders, two families";
     choose("sub\\a_jpp_001_001.prk", &SpltForm::Command8_Click);
-    EXPECT_EQ(page().Label1.text, u"3"_s);
-    EXPECT_EQ(page().Label5.text, u"2"_s);
-    EXPECT_EQ(page().familyWords(0), u"Complete: 1 of 1"_s);
-    EXPECT_EQ(page().familyWords(1), u"Surplus: the folder was read more than once"_s);
+    EXPECT_EQ(page().controls().Label1.text, u"3"_s);
+    EXPECT_EQ(page().controls().Label5.text, u"2"_s);
+    EXPECT_EQ(page().familyRow(0).words, u"Complete: 1 of 1"_s);
+    EXPECT_EQ(page().familyRow(1).words, u"Surplus: the folder was read more than once"_s);
     page().List4Bodedim_Click(1);
-    EXPECT_EQ(page().List4Famely.count(), 2);
+    EXPECT_EQ(page().controls().List4Famely.count(), 2);
     page().ListChalakim_Click(1);
     page().Command6_Click();
-    EXPECT_EQ(page().Label8.text, u"1"_s);
-    EXPECT_EQ(page().Label9.text, u"C:"_s);
+    EXPECT_EQ(page().controls().Label8.text, u"1"_s);
+    EXPECT_EQ(page().controls().Label9.text, u"C:"_s);
 }
 
 TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElse) {
@@ -89,7 +89,7 @@ TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElse) {
     write(at("a.jpp"), "abcdef");
     page().Text2_Change(u"4"_s);
     choose("a.jpp", &SpltForm::Command9_Click);
-    EXPECT_EQ(page().outcome, SpltForm::Outcome::Partly);
+    EXPECT_EQ(page().phase(), SpltForm::Phase::Partly);
     EXPECT_FALSE(machine.files.folderExists(at("meforakim")));
     choose("a_jpp_001_001.prk", &SpltForm::Command9_Click);
     EXPECT_EQ(read(at("meforakim\\a_jpp_001_001_prk_002_002.prk")), "ef");
@@ -100,8 +100,8 @@ TEST_F(SpltFormTest, ACancelledPickChangesNothing) {
     choose("a.jpp", &SpltForm::Command2_Click);
     for (auto click : {&SpltForm::Command2_Click, &SpltForm::Command8_Click, &SpltForm::Command9_Click})
         (page().*click)();
-    EXPECT_EQ(page().List4files.count(), 1);
-    EXPECT_EQ(page().ListChalakim.count(), 0);
+    EXPECT_EQ(page().controls().List4files.count(), 1);
+    EXPECT_EQ(page().controls().ListChalakim.count(), 0);
     EXPECT_EQ(machine.dialogs.messages, QStringList());
 }
 
@@ -125,19 +125,19 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     page().Command3_Click();
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(at("1.jpp")));
-    EXPECT_EQ(page().outcome, SpltForm::Outcome::Failed);
+    EXPECT_EQ(page().phase(), SpltForm::Phase::Failed);
     EXPECT_EQ(read(at("meforakim\\2_jpp_002_002.prk")), "e");
 
     machine.dialogs.messages.clear();
     write(at("meforakim\\a.prk"), "short name");
     choose("meforakim\\2_jpp_001_002.prk", &SpltForm::Command8_Click);
-    ASSERT_EQ(page().List4Bodedim.count(), 2);
+    ASSERT_EQ(page().controls().List4Bodedim.count(), 2);
     ASSERT_TRUE(machine.files.removeFile(at("meforakim\\2_jpp_001_002.prk")).ok());
     for (int i = 0; i < 2; ++i) {
         page().List4Bodedim_Click(i);
         page().Command4_Click();
-        EXPECT_EQ(page().outcome, SpltForm::Outcome::Failed);
-        EXPECT_EQ(page().familyWords(i), u"Not joined"_s);
+        EXPECT_EQ(page().phase(), SpltForm::Phase::Failed);
+        EXPECT_EQ(page().familyRow(i).words, u"Not joined"_s);
     }
     EXPECT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_FALSE(machine.files.folderExists(at("meforakim\\moorkavim")));
@@ -151,12 +151,12 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     for (const char* leaf : {"7.jpp", "8.jpp", "9.jpp"})
         write(at(leaf), "gone before it is cut");
     choose("7.jpp", &SpltForm::Command2_Click);
-    for (const QString& path : page().List4files.items())
+    for (const QString& path : page().controls().List4files.items())
         (void)machine.files.removeFile(path);
     page().Command3_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 1) << "one box for all of them";
     choose("7_jpp_001_001.prk", &SpltForm::Command9_Click);
-    EXPECT_EQ(page().Label4Total.text, u"7_jpp_001_001.prk was not cut to its end. Pieces: 0."_s);
+    EXPECT_EQ(page().controls().Label4Total.text, u"7_jpp_001_001.prk was not cut to its end. Pieces: 0."_s);
 }
 
 TEST_F(SpltFormTest, AFullDiskEndsTheWorkWithOneMessage) {
@@ -181,16 +181,16 @@ TEST_F(SpltFormTest, TheOperatorMayStopOrLeaveBetweenTwoPieces) {
     choose("1.jpp", &SpltForm::Command2_Click);
     page().Text2_Change(u"2"_s);
     machine.pump.onPump = [&] {
-        EXPECT_TRUE(page().Command15.visible);
-        EXPECT_FALSE(page().Command3.enabled);
+        EXPECT_TRUE(page().controls().Command15.visible);
+        EXPECT_FALSE(page().controls().Command3.enabled);
         page().Command3_Click(); // nothing begins below
         if (machine.pump.count == 4)
             page().Command15_Click();
     };
     page().Command3_Click();
     EXPECT_EQ(machine.files.names(at("meforakim"), {u'*'}).size(), 3);
-    EXPECT_FALSE(page().busy);
-    EXPECT_TRUE(page().Label4Total.text.contains(u"stopped"_s));
+    EXPECT_NE(page().phase(), SpltForm::Phase::Working);
+    EXPECT_TRUE(page().controls().Label4Total.text.contains(u"stopped"_s));
 
     machine.pump.onPump = [&] { page().Image3_Click(); };
     page().Command3_Click();

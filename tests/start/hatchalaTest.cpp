@@ -56,28 +56,28 @@ TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     EXPECT_EQ(state.DiskRoot, u"C:\\");
     EXPECT_EQ(state.profile.AdUrl1, u"http://www.lumora.example//ad01.jpg");
     EXPECT_EQ(state.profile.AdFile2, u"C:\\lumora\\zmany\\ad02.jpg");
-    EXPECT_EQ(page.List1.items(), QStringList({"* Haifa", "* Yaffo"}));
-    for (const Caption* label : {&page.Label4Tel, &page.Label4Tel2, &page.Label4Zel})
+    EXPECT_EQ(page.controls().List1.items(), QStringList({"* Haifa", "* Yaffo"}));
+    for (const Caption* label : {&page.controls().Label4Tel, &page.controls().Label4Tel2, &page.controls().Label4Zel})
         EXPECT_EQ(label->text, u"09-9");
-    EXPECT_EQ(page.Notice.text, u"order 104 stays here");
-    EXPECT_TRUE(page.Notice.visible);
+    EXPECT_EQ(page.controls().Notice.text, u"order 104 stays here");
+    EXPECT_TRUE(page.controls().Notice.visible);
     EXPECT_TRUE(state.handOver.notice.isEmpty()) << "the line is for one customer";
-    EXPECT_TRUE(page.Timer2.running() && page.Timer5.running());
-    EXPECT_FALSE(page.Timer1.running() || page.Timer3.running() || page.Timer4.running());
+    EXPECT_TRUE(page.timers().Timer2.running() && page.timers().Timer5.running());
+    EXPECT_FALSE(page.timers().Timer1.running() || page.timers().Timer3.running() || page.timers().Timer4.running());
 }
 
 TEST_F(hatchalaTest, SwitchesItsWordingAndKeepsTwoRows) {
     hatchala& page = start();
     page.Check1_Click(true);
     page.Check1_Click(true);
-    EXPECT_EQ(page.List1.items(), QStringList({"* Recieve by Postmail ", "* Get at stor "}));
-    EXPECT_EQ(page.Image1.hint, u"Start Button");
-    EXPECT_TRUE(page.Label3.visible);
+    EXPECT_EQ(page.controls().List1.items(), QStringList({"* Recieve by Postmail ", "* Get at stor "}));
+    EXPECT_EQ(page.controls().Image1.hint, u"Start Button");
+    EXPECT_TRUE(page.controls().Label3.visible);
     page.Check1_Click(false);
     page.Check1_Click(false);
-    EXPECT_EQ(page.List1.count(), 2);
-    EXPECT_TRUE(page.Image1.hint.isEmpty());
-    EXPECT_FALSE(page.Label4.visible);
+    EXPECT_EQ(page.controls().List1.count(), 2);
+    EXPECT_TRUE(page.controls().Image1.hint.isEmpty());
+    EXPECT_FALSE(page.controls().Label4.visible);
 }
 
 TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
@@ -97,14 +97,14 @@ TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
     EXPECT_TRUE(state.shemot.Mail.isEmpty());
     EXPECT_EQ(state.profile.FtpServer, u"192.0.2.10");
     EXPECT_EQ(state.EnglishTips, 1) << "only the next load of this page clears it";
-    EXPECT_FALSE(page.Timer2.running() || page.Timer5.running());
+    EXPECT_FALSE(page.timers().Timer2.running() || page.timers().Timer5.running());
 }
 
 TEST_F(hatchalaTest, TheCountdownStartsByItself) {
     hatchala& page = start();
     for (int second = 0; second < 5; ++second)
         page.Timer4_Tick();
-    EXPECT_EQ(page.Label6.text, u"0");
+    EXPECT_EQ(page.controls().Label6.text, u"0");
     EXPECT_EQ(chain.front(), &page);
     page.Timer4_Tick();
     EXPECT_EQ(chain.front()->id(), PageId::nnn);
@@ -130,13 +130,13 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
         page.Image1_MouseDown();
         ASSERT_EQ(chain.front(), &page);
         page.Image1_Click();
-        EXPECT_TRUE(page.Picture1.visible && page.Timer3.running());
-        EXPECT_FALSE(page.Timer5.running());
+        EXPECT_TRUE(page.controls().Picture1.visible && page.timers().Timer3.running());
+        EXPECT_FALSE(page.timers().Timer5.running());
         EXPECT_EQ(state.KodMishloach, u"KUP");
         for (int tick = 0; tick < 100; ++tick)
             page.Timer3_Tick();
-        EXPECT_EQ(page.Picture1Width, 230);
-        EXPECT_FALSE(page.Timer3.running());
+        EXPECT_EQ(page.motion().Picture1Width(), 230);
+        EXPECT_FALSE(page.timers().Timer3.running());
         state.MishloachHabaita = true;
         state.shemot.Mail = u"earlier@example.com"_s;
         page.List1_Click(c.row);
@@ -154,7 +154,7 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
 TEST_F(hatchalaTest, APressWithAShopChosenStartsWithTheShop) {
     deployment.DeliveryChoiceMode = 1;
     hatchala& page = start();
-    page.List1.setCurrentIndex(1);
+    page.controls().List1.setCurrentIndex(1);
     page.Image1_MouseDown();
     ASSERT_EQ(chain.front()->id(), PageId::nnn);
     EXPECT_EQ(state.KodMishloach, u"OSK");
@@ -175,25 +175,25 @@ TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
 TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
     hatchala& page = start();
     page.Timer2_Tick();
-    EXPECT_FALSE(page.Timer2.running()) << "no picture on the disk";
+    EXPECT_FALSE(page.timers().Timer2.running()) << "no picture on the disk";
     std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
     site.answer = "picture";
     page.Timer1_Tick();
     EXPECT_EQ(site.urls, QStringList({"http://www.lumora.example//ad01.jpg"}));
-    EXPECT_EQ(page.Picture4, state.profile.AdFile1);
-    EXPECT_TRUE(page.Timer2.running());
-    page.Picture4Width = 100;
+    EXPECT_EQ(page.controls().Picture4, state.profile.AdFile1);
+    EXPECT_TRUE(page.timers().Timer2.running());
+    page.motion().Picture4Width() = 100;
     page.Timer2_Tick();
-    EXPECT_EQ(page.Timer2.interval(), 30);
-    EXPECT_EQ(page.Picture4Width, 100) << "it does not move before it was at a limit";
-    page.Picture4Width = 265;
+    EXPECT_EQ(page.timers().Timer2.interval(), 30);
+    EXPECT_EQ(page.motion().Picture4Width(), 100) << "it does not move before it was at a limit";
+    page.motion().Picture4Width() = 265;
     page.Timer2_Tick();
-    EXPECT_EQ(page.Picture4Width, 264);
+    EXPECT_EQ(page.motion().Picture4Width(), 264);
     for (int tick = 0; tick < 260; ++tick)
         page.Timer2_Tick();
-    EXPECT_EQ(page.Picture4Width, 4);
+    EXPECT_EQ(page.motion().Picture4Width(), 4);
     page.Timer2_Tick();
-    EXPECT_EQ(page.Picture4Width, 5);
+    EXPECT_EQ(page.motion().Picture4Width(), 5);
 }
 
 TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade) {
@@ -201,11 +201,11 @@ TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade
     site.answer = "picture";
     ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "a file in the way").ok());
     page.Timer1_Tick();
-    EXPECT_EQ(page.Picture4, QString());
+    EXPECT_EQ(page.controls().Picture4, QString());
     std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
     ASSERT_TRUE(machine.files.writeWhole(state.profile.AdFile1, "picture").ok());
     page.Timer1_Tick();
-    EXPECT_EQ(page.Picture4, state.profile.AdFile1);
+    EXPECT_EQ(page.controls().Picture4, state.profile.AdFile1);
     EXPECT_EQ(site.urls, QStringList()) << "nothing is fetched then";
 }
 
@@ -214,9 +214,9 @@ TEST_F(hatchalaTest, ThePageThatWaitsAsksForNoRendering) {
     int renderings = 0;
     QObject::connect(&page, &Page::changed, [&] { ++renderings; });
     page.Timer2_Tick();
-    page.Label8Top = 430;
+    page.controls().Label8Top = 430;
     page.Timer5_Tick();
-    EXPECT_EQ(page.Label8Top, 401);
+    EXPECT_EQ(page.controls().Label8Top, 401);
     EXPECT_EQ(renderings, 0);
 }
 
@@ -224,14 +224,14 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     hatchala& page = start();
     page.DownloadSettings();
     page.Command5_Click();
-    EXPECT_EQ(page.List4pices.count(), 21);
+    EXPECT_EQ(page.controls().List4pices.count(), 21);
     const QString path = u"C:\\2000lumora\\tarvelmond.txt"_s;
     EXPECT_EQ(machine.files.read(path)->size(), 203);
-    const QString text = page.Label5.text;
+    const QString text = page.controls().Label5.text;
     page.Command4_Click();
-    EXPECT_NE(page.Label5.text, text);
+    EXPECT_NE(page.controls().Label5.text, text);
     page.Command6_Click();
-    EXPECT_EQ(page.Label5.text, text);
+    EXPECT_EQ(page.controls().Label5.text, text);
 
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages, QStringList({"No Server", "No Server 2"}));
@@ -241,11 +241,11 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_EQ(site.urls.last(), u"http://settings.lumora.example/00natoonim/tarvelmond.txt");
-    EXPECT_EQ(page.List2.items(), QStringList({"TK1=0^TK1=5^X=1^", "second"}));
-    EXPECT_EQ(page.List4pices.items(), QStringList({"TK1=5", "X=1"}));
+    EXPECT_EQ(page.controls().List2.items(), QStringList({"TK1=0^TK1=5^X=1^", "second"}));
+    EXPECT_EQ(page.controls().List4pices.items(), QStringList({"TK1=5", "X=1"}));
     page.ReadSettingsFile(u"C:\\2000lumora\\other.txt"_s);
     EXPECT_EQ(machine.dialogs.messages.last(), u"No Server");
-    EXPECT_TRUE(page.List2.isEmpty());
+    EXPECT_TRUE(page.controls().List2.isEmpty());
 }
 
 } // namespace

@@ -1,5 +1,6 @@
 #include "finished/mail/PackageWalk.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace lumora {
@@ -19,17 +20,22 @@ qint64 MinuteBorders(const QDateTime& from, const QDateTime& to) {
     return wholeMinutes(to) - wholeMinutes(from);
 }
 
-void PackageWalk::begin(const QDateTime& now) {
-    m_start = now;
-    m_elapsed = 0;
+void PackageWalk::begin(int packages, const QDateTime& now) {
+    m_fates.assign(static_cast<std::size_t>(packages), Fate::Waiting);
+    take(now);
 }
 
-PackageWalk::Step PackageWalk::step(int selected, int count, const QDateTime& now) {
-    if (m_elapsed <= minutesOfPackage)
+void PackageWalk::take(const QDateTime& now) {
+    m_start = now;
+    m_minutes = 0;
+}
+
+PackageWalk::Step PackageWalk::step(int inHand, const QDateTime& now) {
+    if (m_minutes <= minutesOfPackage)
         return Step::Wait;
-    if (selected > count - 2)
+    if (inHand > count() - 2)
         return Step::Over;
-    begin(now);
+    take(now);
     return Step::Next;
 }
 
@@ -37,7 +43,20 @@ void PackageWalk::measure(const QDateTime& now) {
     // A clock that was set back would hold the package until it has caught up.
     if (now < m_start)
         m_start = now;
-    m_elapsed = static_cast<double>(MinuteBorders(m_start, now));
+    m_minutes = static_cast<double>(MinuteBorders(m_start, now));
+}
+
+double PackageWalk::share(int inHand) const {
+    constexpr double wholeMinutesOfPackage = minutesOfPackage + 1;
+    return count() == 0 ? 0 : (inHand + std::min(m_minutes / wholeMinutesOfPackage, 1.0)) / count();
+}
+
+PackageWalk::Fate PackageWalk::fate(int package) const {
+    return package >= 0 && package < count() ? m_fates[static_cast<std::size_t>(package)] : Fate::Waiting;
+}
+
+int PackageWalk::count(Fate fate) const {
+    return static_cast<int>(std::count(m_fates.begin(), m_fates.end(), fate));
 }
 
 } // namespace lumora

@@ -21,13 +21,12 @@ void FilesToSend::setPattern(const QString& patterns) {
 }
 
 void FilesToSend::refresh() {
-    m_names.clear();
-    m_names.append(m_files.names(m_folder, m_pattern));
-    m_marked.assign(static_cast<std::size_t>(m_names.count()), false);
+    m_names = m_files.names(m_folder, m_pattern);
+    m_marked.assign(static_cast<std::size_t>(m_names.size()), false);
 }
 
 bool FilesToSend::isMarked(int index) const {
-    return index >= 0 && index < m_names.count() && m_marked[static_cast<std::size_t>(index)];
+    return index >= 0 && index < m_names.size() && m_marked[static_cast<std::size_t>(index)];
 }
 
 int FilesToSend::markedCount() const {
@@ -35,22 +34,21 @@ int FilesToSend::markedCount() const {
 }
 
 void FilesToSend::turnMark(int index) {
-    m_names.setCurrentIndex(index);
-    if (m_names.currentIndex() >= 0)
+    if (index >= 0 && index < m_names.size())
         m_marked[static_cast<std::size_t>(index)].flip();
 }
 
 void FilesToSend::markAll(Travel Mefurak) {
-    for (int i = 0; i < m_names.count(); ++i)
-        m_marked[static_cast<std::size_t>(i)] =
-            Mefurak == Travel::Whole || IsPiece(m_names.item(i)) || IsSheet(m_names.item(i));
+    std::transform(m_names.begin(), m_names.end(), m_marked.begin(), [Mefurak](const QString& name) {
+        return Mefurak == Travel::Whole || IsPiece(name) || IsSheet(name);
+    });
 }
 
 QStringList FilesToSend::markedNames() const {
     QStringList names;
-    for (int i = 0; i < m_names.count(); ++i) {
+    for (int i = 0; i < m_names.size(); ++i) {
         if (isMarked(i))
-            names.append(m_names.item(i));
+            names.append(m_names[i]);
     }
     return names;
 }
@@ -67,9 +65,9 @@ QStringList FilesToSend::markedPaths() const {
 }
 
 std::optional<QString> FilesToSend::unmarkedSheet() const {
-    if (m_names.isEmpty() || isMarked(0) || !IsSheet(m_names.item(0)))
+    if (m_names.isEmpty() || isMarked(0) || !IsSheet(m_names.first()))
         return std::nullopt;
-    return JoinDrivePath(m_folder, m_names.item(0));
+    return JoinDrivePath(m_folder, m_names.first());
 }
 
 QStringList FilesToSend::resendList() const {

@@ -2,7 +2,6 @@
 
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
-#include "session/TextList.h"
 
 #include <cstdint>
 #include <optional>
@@ -25,8 +24,8 @@ public:
     void refresh();
 
     const QString& folder() const { return m_folder; }
-    // Leaf names, sorted without regard to case in one order over all patterns. The current one was touched last.
-    const TextList& names() const { return m_names; }
+    // Leaf names, sorted without regard to case in one order over all patterns.
+    const QStringList& names() const { return m_names; }
     bool isMarked(int index) const;
     int markedCount() const;
 
@@ -52,7 +51,7 @@ private:
     const Files& m_files;
     QString m_folder;
     QString m_pattern = wholeFiles;
-    TextList m_names;
+    QStringList m_names;
     std::vector<bool> m_marked;
 };
 

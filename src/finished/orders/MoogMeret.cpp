@@ -3,162 +3,198 @@
 #include "common/DrivePathText.h"
 #include "finished/orders/UnreadableFolders.h"
 #include "imaging/files/PictureFile.h"
+#include "order/OrderDetailsReader.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"
-#include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "session/Workspace.h"
 
 #include <algorithm>
+#include <array>
 #include <utility>
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-constexpr int walkTick = 30;
+constexpr int walkTick = 30; // milliseconds
 // A sheet in the preview is shrunk to this many windows, so that half of it is in sight and its text can be read.
 constexpr int previewWindows = 2;
+
+// What each phase but Leaving shows; the page that leaves stays as it is.
+constexpr struct {
+    Caption MoogMeretControls::*control;
+    std::array<bool, 4> in; // Orders, Picked, Walking, Walked
+} shownBy[] = {
+    {&MoogMeretControls::Picture3, {true, true, false, false}},
+    {&MoogMeretControls::Picture2, {false, true, false, false}},
+    {&MoogMeretControls::Label4Shalav3, {false, true, false, false}},
+    {&MoogMeretControls::Command4, {true, true, false, false}},
+    {&MoogMeretControls::Command2, {true, true, false, true}},
+    {&MoogMeretControls::Command28, {true, true, false, true}},
+    {&MoogMeretControls::Label13, {false, false, true, false}},
+    {&MoogMeretControls::Label4Mana, {false, false, true, false}},
+    {&MoogMeretControls::Label4Shem, {false, false, true, false}},
+    {&MoogMeretControls::Label24, {false, false, true, false}},
+    {&MoogMeretControls::Command19, {false, false, true, false}},
+    {&MoogMeretControls::Label4Shaa, {false, false, true, true}},
+    {&MoogMeretControls::Command18, {false, false, false, true}},
+    {&MoogMeretControls::Command4Orders, {false, false, false, true}},
+};
 
 } // namespace
 
 MoogMeret::MoogMeret(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::MoogMeret)
-    , File1(platform.files)
-    , Timer3(walkTick, [this] { Timer3_Tick(); })
     , m_state(state)
     , m_platform(platform)
-    , m_chain(chain) {
-    for (Caption* hidden : {&Picture2, &Picture3, &Label4Rek, &Label4Pieces, &Label4Reka, &Label24, &Command13,
-                            &Command19, &Command18, &Command4Orders})
-        hidden->visible = false;
-    List1Shown.enabled = false;
-    connect(&chain, &PageChain::ended, this, [this] { Timer3.stop(); });
-    connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
+    , m_chain(chain)
+    , m_files(platform.files)
+    , Timer3(walkTick, [this] { stepWalk(); }) {
+    connect(&chain, &PageChain::ended, this, [this] { enter(Phase::Leaving); });
+    connect(&chain, &PageChain::unloaded, this, [this](const Page* page) {
         if (page == this)
-            Timer3.stop();
+            enter(Phase::Leaving);
     });
 }
 
 void MoogMeret::load() {
     if (m_platform.instances.another() &&
-        !m_platform.dialogs.ask(QStringLiteral("Create another instance of this project\n") +
-                                    m_state.wording(QStringLiteral("התוכנה כבר פועלת במחשב זה. להמשיך גם כאן?"),
-                                                    QStringLiteral("The program is running on this computer already. "
-                                                                   "Go on here too?")),
-                                QStringLiteral("Send E-Mail Project"))) {
+        !m_platform.dialogs.ask(
+            u"Create another instance of this project\n"_s +
+                m_state.wording(u"התוכנה כבר פועלת במחשב זה. להמשיך גם כאן?"_s,
+                                u"The program is running on this computer already. Go on here too?"_s),
+            u"Send E-Mail Project"_s)) {
         leaveProgram();
         return;
     }
-    Command4Pieces.visible = m_state.SplitPage && m_chain.isRegistered(PageId::SpltForm);
+    Command4Pieces.visible = m_state.SplitPage && m_chain.canFollow(PageId::MoogMeret, Outcome::PiecesWanted);
     const QStringList handedOver = std::exchange(m_state.handOver.lines, {});
     List1.append(handedOver);
-    Command3_Click();
+    listOrderInHand();
     const QString& customer = m_state.shemot.n1;
     for (Caption* label : {&Label23, &Label20, &Label10, &Label7})
         label->text = customer == notChosen ? QString() : customer;
-    Command5_Click();
-    Picture3.visible = true;
+    refreshOrders();
     // The order that the preparation gives over is the one to be sent.
     if (!handedOver.isEmpty())
-        List3_Click(List2.find(FolderOfPath(handedOver.first())));
+        pickOrder(List2.find(FolderOfPath(handedOver.first())));
 }
 
-void MoogMeret::Command3_Click() {
-    if (m_sending)
+void MoogMeret::enter(Phase phase) {
+    m_phase = phase;
+    if (phase == Phase::Leaving) {
+        Timer3.stop();
         return;
-    const QString& folder = m_state.transfer.OrderFolder;
-    Label1.text = QStringLiteral("0");
-    if (FolderOfPath(folder) != WorkspacePaths::orders(m_state) || !m_platform.files.folderExists(folder))
-        return;
-    File1.setFolder(folder);
-    for (const QString& name : File1.names().items())
-        List1.append(JoinDrivePath(folder, name));
-    Label1.text = QString::number(File1.names().count());
+    }
+    for (const auto& [control, in] : shownBy)
+        (this->*control).visible = in[static_cast<std::size_t>(phase)];
     Q_EMIT changed();
 }
 
-void MoogMeret::Command5_Click() {
-    if (m_sending || m_walking)
+bool MoogMeret::mayAct() const {
+    return m_phase != Phase::Walking && m_phase != Phase::Leaving && !sending();
+}
+
+// --- the orders and their files ---
+
+// The session's order, as the preparation left it.
+void MoogMeret::listOrderInHand() {
+    const QString& folder = m_state.transfer.OrderFolder;
+    Label1.text = u"0"_s;
+    if (FolderOfPath(folder) != WorkspacePaths::orders(m_state) || !m_platform.files.folderExists(folder))
+        return;
+    listFiles(folder);
+    for (const QString& name : File1.items())
+        List1.append(JoinDrivePath(folder, name));
+    Label1.text = QString::number(File1.count());
+    Q_EMIT changed();
+}
+
+void MoogMeret::refreshOrders() {
+    if (!mayAct())
         return;
     const QString orders = WorkspacePaths::orders(m_state) + u'\\';
-    File1.setFolder(m_state.DiskRoot);
+    listFiles(m_state.DiskRoot);
+    openFolder(orders);
     List2.clear();
     List3.clear();
-    if (Dir1Path == orders) {
-        Dir1.clear();
-        Dir1.append(m_platform.files.folders(orders));
-    } else {
-        Dir1_Change(orders);
-    }
     for (const QString& name : Dir1.items()) {
         List2.append(JoinDrivePath(orders, name));
         List3.append(name);
     }
-    Picture2.visible = false;
     Picture1 = {};
-    leaveWalk();
     Label4Rek.visible = List3.isEmpty();
     Label4Bhar.visible = !List3.isEmpty();
-    showSendButtons(true);
-    Q_EMIT changed();
+    enter(Phase::Orders);
 }
 
-void MoogMeret::Dir1_Change(const QString& folder) {
-    if (m_sending || m_walking)
-        return;
-    Dir1Path = folder;
+// The list of files follows the list of folders only when that one moves.
+void MoogMeret::openFolder(const QString& folder) {
+    if (std::exchange(Dir1Path, folder) != folder)
+        listFiles(folder);
     Dir1.clear();
     Dir1.append(m_platform.files.folders(folder));
-    File1.setFolder(folder);
-    Q_EMIT changed();
 }
 
-void MoogMeret::List3_Click(int index) {
-    if (m_sending || m_walking || index < 0 || index >= List3.count())
+void MoogMeret::listFiles(const QString& folder) {
+    m_files.setFolder(folder);
+    File1.clear();
+    File1.append(m_files.names());
+}
+
+void MoogMeret::pickOrder(int index) {
+    if (!mayAct() || index < 0 || index >= List3.count())
         return;
     List3.setCurrentIndex(index);
     List2.setCurrentIndex(index);
     const QString folder = List2.currentItem();
-    Picture2.visible = true;
-    Label4Bhar.visible = false;
     m_state.transfer.OrderFolder = folder;
     // Neither is set back by a later folder: the lab's people may send what an order in pieces came from.
     if (TravelsInPieces(List3.currentItem())) {
         m_state.transfer.Mefurak = Travel::Pieces;
-        File1.setPattern(FilesToSend::withPieces);
+        m_files.setPattern(FilesToSend::withPieces);
     }
-    File1.setFolder(folder);
-    leaveWalk();
+    listFiles(folder);
+    enter(Phase::Picked);
     showOrder(folder);
     loadPreview();
-    showSendButtons(true);
-    Command1_Click();
+    markAll();
 }
 
 void MoogMeret::showOrder(const QString& folder) {
-    Label1.text = QString::number(File1.names().count());
-    Label4Reka.visible = File1.names().isEmpty();
+    Label1.text = QString::number(File1.count());
+    Label4Reka.visible = File1.isEmpty();
     Label4Pieces.visible = m_state.transfer.Mefurak == Travel::Pieces;
     showWhatIsMarked();
     const OrderDetails details = detailsOf(folder);
     const QString customer = QString(details.n1 + u' ' + details.n2).trimmed();
     Label4Lakoach.visible = !customer.isEmpty();
-    Label4Lakoach.text = m_state.wording(QStringLiteral("לקוח: %1"), QStringLiteral("Customer: %1")).arg(customer);
+    Label4Lakoach.text = m_state.wording(u"לקוח: %1"_s, u"Customer: %1"_s).arg(customer);
     QStringList unreadable;
     m_platform.files.collect(folder, Files::Depth::ThisFolder, &unreadable);
     TellUnreadableFolders(m_state, m_platform.dialogs, unreadable);
+}
+
+OrderDetails MoogMeret::detailsOf(const QString& folder) const {
+    OrderDetails details;
+    const QString text = OrderFolder(folder).logPath();
+    if (m_platform.files.fileExists(text))
+        ReadResentDetails(m_platform.files, text, details);
+    return details;
 }
 
 // A first file that is no picture, as a print file or a piece, leaves the window empty.
 void MoogMeret::loadPreview() {
     Picture1 = {};
     HScroll1 = VScroll1 = {};
-    const auto path = m_platform.files.drives().toHost(JoinDrivePath(File1.folder(), File1.names().item(0)));
-    if (File1.names().isEmpty() || !path)
+    const auto path = m_platform.files.drives().toHost(JoinDrivePath(m_files.folder(), File1.item(0)));
+    if (File1.isEmpty() || !path)
         return;
     const auto size = readPictureSize(*path);
     if (!size)
@@ -174,101 +210,88 @@ void MoogMeret::loadPreview() {
     VScroll1.max = std::max(0, Picture1.height() - previewHeight) / scrollStep;
 }
 
-void MoogMeret::HScroll1_Change(int value) {
-    HScroll1.value = std::clamp(value, 0, HScroll1.max);
+void MoogMeret::scroll(Scroll& bar, int value) {
+    bar.value = std::clamp(value, 0, bar.max);
     Q_EMIT changed();
 }
 
-void MoogMeret::VScroll1_Change(int value) {
-    VScroll1.value = std::clamp(value, 0, VScroll1.max);
-    Q_EMIT changed();
-}
-
-void MoogMeret::File1_Click(int index) {
-    if (m_sending || m_walking)
+void MoogMeret::turnMark(int index) {
+    if (!mayAct())
         return;
-    File1.turnMark(index);
+    File1.setCurrentIndex(index);
+    m_files.turnMark(index);
     ShowFamilyCount();
 }
 
-void MoogMeret::Command1_Click() {
-    if (m_sending || m_walking)
+void MoogMeret::markAll() {
+    if (!mayAct())
         return;
-    File1.markAll(m_state.transfer.Mefurak);
+    m_files.markAll(m_state.transfer.Mefurak);
     ShowFamilyCount();
 }
 
-void MoogMeret::Command21_Click() {
-    if (m_sending || m_walking)
+void MoogMeret::markNone() {
+    if (!mayAct())
         return;
-    File1.refresh();
+    listFiles(m_files.folder());
     ShowFamilyCount();
 }
 
 void MoogMeret::ShowFamilyCount() {
-    m_state.shemot.TotalPics = File1.familyCount();
+    m_state.shemot.TotalPics = m_files.familyCount();
     Label5.text = QString::number(m_state.shemot.TotalPics);
     Q_EMIT changed();
 }
 
-void MoogMeret::showSendButtons(bool shown) {
-    Command2.visible = Command4.visible = shown;
-    Q_EMIT changed();
-}
+// --- the ways on ---
 
 // The list goes to the FTP sender; the HTTP sender takes the order's folder whole, and asks its server what is missing.
-void MoogMeret::Command4_Click() {
-    if (m_leaving || m_sending || m_walking || !Command4.visible)
+void MoogMeret::sendAgain() {
+    if (!mayAct() || !Command4.visible)
         return;
-    showSendButtons(false);
     List1.clear();
-    List1.append(File1.resendList());
+    List1.append(m_files.resendList());
     if (List1.isEmpty()) {
-        m_platform.dialogs.message(m_state.wording(
-            QStringLiteral("לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"),
-            QStringLiteral("You chose no files to send from the yellow window.\rRead the instructions of step two.")));
-        showSendButtons(true);
+        tellNothingIsMarked(m_state.wording(
+            u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"_s,
+            u"You chose no files to send from the yellow window.\rRead the instructions of step two."_s));
         return;
     }
-    m_leaving = true;
+    enter(Phase::Leaving);
     m_state.transfer.SugMishloah = Sending::Resend;
-    m_state.transfer.OrderFolder = File1.folder();
+    m_state.transfer.OrderFolder = m_files.folder();
     const bool byHttp = m_state.transfer.SugSheliach == Sender::Http;
     if (!byHttp)
         m_state.handOver.lines = List1.items();
     m_chain.follow(PageId::MoogMeret, byHttp ? Outcome::ResentByHttp : Outcome::ResentByFtp);
 }
 
-void MoogMeret::Command6_Click() {
-    leaveProgram();
+// Both ways of sending are hidden until the box is read.
+void MoogMeret::tellNothingIsMarked(const QString& words) {
+    Command2.visible = Command4.visible = false;
+    Q_EMIT changed();
+    m_platform.dialogs.message(words);
+    enter(m_phase);
 }
 
-// Hidden while packages are on their way.
-void MoogMeret::Command18_Click() {
-    if (Command18.visible)
-        leaveProgram();
-}
-
-void MoogMeret::Command28_Click() {
-    if (m_leaving || m_sending || m_walking)
+void MoogMeret::beginNewOrder() {
+    if (!mayAct())
         return;
-    m_leaving = true;
+    enter(Phase::Leaving);
     m_chain.follow(PageId::MoogMeret, Outcome::NewOrderWanted);
 }
 
-void MoogMeret::Command4Orders_Click() {
-    Command5_Click();
-}
-
-// It leads back here.
-void MoogMeret::Command4Pieces_Click() {
-    if (!m_leaving && !m_sending && !m_walking)
+void MoogMeret::showPieces() {
+    if (mayAct())
         m_chain.follow(PageId::MoogMeret, Outcome::PiecesWanted);
 }
 
+void MoogMeret::leaveAfterWalk() {
+    if (m_phase == Phase::Walked)
+        leaveProgram();
+}
+
 void MoogMeret::leaveProgram() {
-    m_leaving = true;
-    Timer3.stop();
     m_chain.endProgram();
 }
 

@@ -8,86 +8,46 @@
 #include "session/TextList.h"
 #include "session/Ticker.h"
 
-#include <vector>
-
 namespace lumora {
 
 class PageChain;
 struct OrderDetails;
 struct Platform;
-struct SessionState;
 
-// The page of orders that are already prepared. The customer picks one order folder and its files, and has them sent
-// again by the order senders, or walked out as mail packages, one every few minutes. Nothing of an order is changed
-// here, whatever becomes of the sending.
-class MoogMeret : public Page {
-    Q_OBJECT
-public:
-    MoogMeret(SessionState& state, const Platform& platform, PageChain& chain);
+struct MoogMeretControls : Controls {
+    Caption Title{*this, u"Title"};
 
-    void load() override;
-    void setTexts() override;
+    Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // step one: the orders
+    Caption Label4Shalav1{*this, u"Label4Shalav1"};
+    TextList Dir1{*this, u"Dir1"};                               // folders below Dir1Path
+    QString Dir1Path;                                            // drive path
+    TextList List2{*this, u"List2"};                             // full paths of the order folders
+    TextList List3{*this, u"List3"};                             // their leaf names
+    Caption Label4Rek{*this, u"Label4Rek", Caption::At::Hidden}; // there is no order at all
+    Caption Label4Bhar{*this, u"Label4Bhar"};                    // none is picked yet
+    Caption Command5{*this, u"Command5"};                        // refresh
+    Caption Command4Pieces{*this, u"Command4Pieces", Caption::At::Hidden};
 
-    // --- events ---
+    Caption Picture2{*this, u"Picture2", Caption::At::Hidden}; // step two: the files of the order, the yellow window
+    Caption Label4Shalav2{*this, u"Label4Shalav2"};
+    TextList File1{*this, u"File1"};            // leaf names; the current one was touched last
+    Caption Label1{*this, u"Label1"};           // files in the order
+    Caption Label5{*this, u"Label5"};           // pictures in the marked files
+    Caption Label4Files{*this, u"Label4Files"}; // what the two numbers count
+    Caption Label4Prints{*this, u"Label4Prints"};
+    Caption Label4Pieces{*this, u"Label4Pieces", Caption::At::Hidden}; // only pieces are marked by themselves
+    Caption Label4Reka{*this, u"Label4Reka", Caption::At::Hidden};     // the order has no file to send
+    Caption Command1{*this, u"Command1"};                              // all files
+    Caption Command21{*this, u"Command21"};                            // none
+    Caption Label23{*this, u"Label23"};                                // the customer's name, at four places
+    Caption Label20{*this, u"Label20"};
+    Caption Label10{*this, u"Label10"};
+    Caption Label7{*this, u"Label7"};
+    Caption Label4Lakoach{*this, u"Label4Lakoach"}; // whose order it is, as its text tells
 
-    void List3_Click(int index);             // an order; also when it is chosen already
-    void Dir1_Change(const QString& folder); // drive path
-    void File1_Click(int index);             // marks a file, or takes its mark away
-    void HScroll1_Change(int value);
-    void VScroll1_Change(int value);
-    void Command1_Click();       // choose all the files
-    void Command21_Click();      // cancel the whole choice
-    void Command4_Click();       // send again
-    void Command2_Click();       // send by e-mail
-    void Command5_Click();       // refresh the order list
-    void Command19_Click();      // stop the walk
-    void Command18_Click();      // exit, once the walk is over
-    void Command6_Click();       // cancel all and leave the program
-    void Command28_Click();      // back to the start page
-    void Command4Orders_Click(); // from the walk that has ended back to the orders
-    void Command4Pieces_Click(); // to the operator's page of pieces
-    void List1_Click(int index); // a package, once the walk is over or stopped
-    void Label13_Click();        // starts the package's minutes anew
-    void Timer3_Tick();
-
-    // Pressed by the page itself.
-    void Command3_Click();  // lists the order that the session is at
-    void Command20_Click(); // lists the packages
-    void Command13_Click(); // begins the walk
-    void Command12_Click(); // one step of the walk
-
-    // --- state ---
-
-    Caption Title;
-    Caption Picture3; // step one: the orders
-    Caption Label4Shalav1;
-    TextList Dir1; // folders below the folder that Dir1 is at
-    QString Dir1Path;
-    TextList List2;     // full paths of the order folders
-    TextList List3;     // their leaf names
-    Caption Label4Rek;  // shown when there is no order at all
-    Caption Label4Bhar; // shown while none is picked
-    Caption Command5;
-
-    Caption Picture2; // step two: the files of the chosen order, the yellow window
-    Caption Label4Shalav2;
-    FilesToSend File1;
-    Caption Label1;      // files in the chosen order
-    Caption Label5;      // pictures in the marked files
-    Caption Label4Files; // what the two numbers count
-    Caption Label4Prints;
-    Caption Label4Pieces; // shown when only pieces are marked by themselves
-    Caption Label4Reka;   // shown when the order has no file to send
-    Caption Command1;
-    Caption Command21;
-    Caption Label23; // the customer's name, at four places
-    Caption Label20;
-    Caption Label10;
-    Caption Label7;
-    Caption Label4Lakoach; // whose order it is that was picked, as its text tells
-
-    // The preview of the order's first file: a window of this size on Picture1, which lies 4 pixels further up and left
-    // for each step of the scroll bars.
+    Caption Label4Shalav3{*this, u"Label4Shalav3", Caption::At::Hidden}; // step three
+    // The preview of the order's first file: a window of this size on Picture1, which lies scrollStep pixels further up
+    // and left for each step of the scroll bars.
     static constexpr int previewWidth = 280;
     static constexpr int previewHeight = 210;
     static constexpr int scrollStep = 4;
@@ -98,67 +58,143 @@ public:
     Bitmap Picture1; // null when the file is no picture
     Scroll HScroll1;
     Scroll VScroll1;
+    Caption Label4Tmuna{*this, u"Label4Tmuna"}; // what the preview is, in spoken words
+    Caption Command4{*this, u"Command4"};       // send again
+    Caption Command2{*this, u"Command2"};       // send by mail
+    Caption Command6{*this, u"Command6"};       // leave the program
+    Caption Command28{*this, u"Command28"};     // new order
+    Caption Command4Orders{*this, u"Command4Orders", Caption::At::Hidden};
 
-    Caption Label4Shalav3; // step three
-    Caption Command4;
-    Caption Command2;
-    Caption Command6;
-    Caption Command28;
-    Caption Command4Orders;
-    Caption Command4Pieces; // shown where the lab's file says so
+    TextList List1{*this, u"List1"};            // files to go, full paths; the current one is the package in hand
+    Caption Label9{*this, u"Label9"};           // "the sending was cut into small parts"
+    Caption Label2{*this, u"Label2"};           // "the pictures are packed and will go in", and how many
+    Caption Label3{*this, u"Label3"};           // "packages"
+    Caption Label13{*this, u"Label13"};         // minutes on the package in hand
+    Caption Label4Dakot{*this, u"Label4Dakot"}; // "minutes on this package"
+    Caption Label4Shaa{*this, u"Label4Shaa"};   // the time of day
+    Caption Label4Mana{*this, u"Label4Mana"};   // "package 2 of 5"
+    Caption Label4Shem{*this, u"Label4Shem"};   // name of the file in hand
+    Caption Label4Doar{*this, u"Label4Doar"};   // what the mail server said of the latest package
+    Caption Label4Sof{*this, u"Label4Sof"};     // what has come of the packages, and where the files are
+    Caption Label24{*this, u"Label24"};         // "the exit button will work after all the packages"
+    Caption Command13{*this, u"Command13", Caption::At::Hidden};
+    Caption Command18{*this, u"Command18"}; // exit, once the walk is over
+    Caption Command19{*this, u"Command19"}; // stop the walk
+};
 
-    // The walk.
-    TextList List1;      // the files to go, full paths; in the walk the current one is the package in hand
-    Caption List1Shown;  // whether the customer sees it and may pick from it
-    Caption Label9;      // "the sending was cut into small parts"
-    Caption Label2;      // "the pictures are packed and will go in", and how many
-    Caption Label3;      // "packages"
-    Caption Label13;     // minutes on the present package
-    Caption Label4Dakot; // "minutes on this package"
-    Caption Label4Shaa;  // the time of day
-    Caption Label4Mana;  // "package 2 of 5"
-    Caption Label4Shem;  // name of the file in hand
-    Caption Label4Doar;  // what the mail server said of the latest package
-    Caption Label4Sof;   // what has come of the packages, and where the files are
-    Caption Label24;     // "the exit button will work after all the packages"
-    Caption Command13;
-    Caption Command18;
-    Caption Command19;
-    Ticker Timer3; // 30 ms
+// The page of finished orders (MoogMeret, "finished"): the customer picks an order that was prepared before and its
+// files, and has them sent again by the order's sender, or by mail in packages, one every few minutes. Nothing of the
+// order is changed, whatever becomes of the sending.
+class MoogMeret : public Page, private MoogMeretControls {
+    Q_OBJECT
+public:
+    MoogMeret(SessionState& state, const Platform& platform, PageChain& chain);
 
-    enum class Package { Waiting, Sending, Sent, Failed };
-    Package package(int index) const;
-    bool walking() const { return m_walking; }               // packages are on their way
-    bool walkShown() const { return m_walking || m_walked; } // or were, and what came of it is looked at
-    bool sending() const { return m_sending; }               // a message is: the mail server is being talked to
+    void load() override;
+    void setTexts() override;
 
-    // The signal is Page::changed().
+    // --- events ---
+
+    void Command5_Click() { refreshOrders(); }
+    void List3_Click(int index) { pickOrder(index); } // also when it is picked already
+    void File1_Click(int index) { turnMark(index); }
+    void Command1_Click() { markAll(); }
+    void Command21_Click() { markNone(); }
+    void HScroll1_Change(int value) { scroll(HScroll1, value); }
+    void VScroll1_Change(int value) { scroll(VScroll1, value); }
+    void Command4_Click() { sendAgain(); }
+    void Command2_Click() { sendByMail(); }
+    void Timer3_Tick() { stepWalk(); }
+    void Label13_Click() { clearMinutes(); }
+    void Command19_Click() { stopWalk(); }
+    void List1_Click(int index) { pickPackage(index); }
+    void Command4Orders_Click() { refreshOrders(); }
+    void Command4Pieces_Click() { showPieces(); }
+    void Command28_Click() { beginNewOrder(); }
+    void Command18_Click() { leaveAfterWalk(); }
+    void Command6_Click() { leaveProgram(); }
+
+    // Nobody sees these controls: MoogMeretUnused.cpp.
+    void Command3_Click();
+    void Command12_Click();
+    void Command13_Click();
+    void Command20_Click();
+    void Dir1_Change(const QString& folder); // drive path
+
+    // --- state ---
+
+    enum class Phase {
+        Orders,  // none is picked
+        Picked,  // one is, and its files are marked
+        Walking, // its files go out as mail packages
+        Walked,  // they did, or were stopped; a package that was not sent may be picked again
+        Leaving, // for another page, or the end of the program
+    };
+    Phase phase() const { return m_phase; }
+    const MoogMeretControls& controls() const override { return *this; }
+    const FilesToSend& files() const { return m_files; }
+    // An order as a person reads it. Its hint says that it travels in pieces, and is empty where it does not.
+    struct OrderRow {
+        QString text;
+        QString hint;
+    };
+    OrderRow orderRow(const QString& folderName) const;
+    const PackageWalk& walk() const { return m_walk; }
+    // What the mail has brought: Good is what the server has taken, in the walk one package, behind it all of them.
+    enum class Answer { None, Sending, Good, Bad };
+    Answer answer() const;
+    int packagesDone() const; // sent; where no mail server is set up, shown
+    bool clockRuns() const { return Timer3.running(); }
+
+    // What it tells: changed().
 
 private:
-    void ShowFamilyCount();
-    void loadPreview();
+    void enter(Phase phase);
+    bool mayAct() const;
+    bool sending() const { return m_walk.count(PackageWalk::Fate::Sending) > 0; }
+
+    void refreshOrders();
+    void listOrderInHand();
+    void openFolder(const QString& folder);
+    void listFiles(const QString& folder);
+    void pickOrder(int index);
     void showOrder(const QString& folder);
     void showWhatIsMarked();
-    void showSendButtons(bool shown);
+    void loadPreview();
+    void scroll(Scroll& bar, int value);
+    void turnMark(int index);
+    void markAll();
+    void markNone();
+    void ShowFamilyCount();
+    void sendAgain();
+    void tellNothingIsMarked(const QString& words);
+    void beginNewOrder();
+    void showPieces();
+    void leaveAfterWalk();
+    void leaveProgram();
+
+    void sendByMail();
+    void listPackages();
+    void beginWalk();
+    void stepWalk();
+    void stopWalk();
+    void endWalk();
+    void clearMinutes();
+    void pickPackage(int index);
     void selectPackage(int index);
     void sendPackage(int index);
-    void endWalk();
-    void leaveWalk();
     void showWalk();
     void showOutcome();
-    bool mailSetUp() const;
+    bool mailSetUp() const { return m_state.profile.mail.setUp(); }
     OrderDetails detailsOf(const QString& folder) const;
-    void leaveProgram();
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
+    FilesToSend m_files;
     PackageWalk m_walk;
-    std::vector<Package> m_packages; // of List1
-    bool m_walking = false;
-    bool m_walked = false;
-    bool m_sending = false;
-    bool m_leaving = false;
+    Ticker Timer3;
+    Phase m_phase = Phase::Orders;
 };
 
 } // namespace lumora

@@ -3,151 +3,118 @@
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
 #include "finished/orders/MoogMeret.h"
-#include "order/OrderDetailsReader.h"
-#include "order/OrderFolder.h"
-#include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
-#include "platform/line/Mail.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 
-#include <algorithm>
 #include <utility>
 
 namespace lumora {
 
-MoogMeret::Package MoogMeret::package(int index) const {
-    return index >= 0 && static_cast<std::size_t>(index) < m_packages.size()
-               ? m_packages[static_cast<std::size_t>(index)]
-               : Package::Waiting;
+using namespace Qt::StringLiterals;
+
+MoogMeret::Answer MoogMeret::answer() const {
+    if (sending())
+        return Answer::Sending;
+    if (m_walk.count(PackageWalk::Fate::Failed) > 0)
+        return Answer::Bad;
+    const bool good = m_phase == Phase::Walking ? m_walk.count(PackageWalk::Fate::Sent) > 0 : m_walk.allSent();
+    return good ? Answer::Good : Answer::None;
 }
 
-bool MoogMeret::mailSetUp() const {
-    return m_state.profile.mail.setUp();
+int MoogMeret::packagesDone() const {
+    return mailSetUp() ? m_walk.count(PackageWalk::Fate::Sent) : List1.currentIndex() + 1;
 }
 
-void MoogMeret::Command2_Click() {
-    if (m_leaving || m_sending || m_walking || !Command2.visible)
+void MoogMeret::sendByMail() {
+    if (!mayAct() || !Command2.visible)
         return;
-    showSendButtons(false);
-    List1Shown.enabled = true;
-    Command20_Click();
-    if (List1.isEmpty()) {
-        m_platform.dialogs.message(
-            m_state.wording(QStringLiteral("לא בחרת קבצים למשלוח מתוך החלון הצהב"),
-                            QStringLiteral("You chose no files to send from the yellow window.")));
-        showSendButtons(true);
-        return;
-    }
-    Command13_Click();
+    listPackages();
+    if (List1.isEmpty())
+        tellNothingIsMarked(m_state.wording(u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s,
+                                            u"You chose no files to send from the yellow window."_s));
+    else
+        beginWalk();
 }
 
-void MoogMeret::Command20_Click() {
-    if (m_sending || m_walking)
+void MoogMeret::listPackages() {
+    if (!mayAct())
         return;
     List1.clear();
-    List1.append(File1.mailList());
-    m_packages.assign(static_cast<std::size_t>(List1.count()), Package::Waiting);
+    List1.append(m_files.mailList());
     Q_EMIT changed();
 }
 
-void MoogMeret::Command13_Click() {
-    if (m_sending || List1.isEmpty())
+void MoogMeret::beginWalk() {
+    if (sending() || List1.isEmpty())
         return;
-    m_packages.resize(static_cast<std::size_t>(List1.count()), Package::Waiting);
-    m_walking = true;
-    Command18.visible = Command28.visible = Command4Orders.visible = false;
-    Command19.visible = Label24.visible = true;
-    List1Shown.visible = false;
-    Label4Doar.text = mailSetUp()
-                          ? QString()
-                          : m_state.wording(QStringLiteral("לא הוגדר שרת דואר, ולכן המנות רק נספרות ואינן נשלחות."),
-                                            QStringLiteral("No mail server is set up, so the packages are only "
-                                                           "counted and not sent."));
+    const QDateTime now = m_platform.clock.now();
+    m_walk.begin(List1.count(), now);
+    Label4Doar.text =
+        mailSetUp() ? QString()
+                    : m_state.wording(u"לא הוגדר שרת דואר, ולכן המנות רק נספרות ואינן נשלחות."_s,
+                                      u"No mail server is set up, so the packages are only counted and not sent."_s);
     Label4Sof.text.clear();
-    Label4Shaa.text = m_platform.clock.now().toString(QStringLiteral("HH:mm:ss"));
-    m_walk.begin(m_platform.clock.now());
+    Label4Shaa.text = now.toString(u"HH:mm:ss"_s);
+    enter(Phase::Walking);
     selectPackage(0);
-    // The message may have taken its time, or the customer may have left or stopped meanwhile.
-    if (!m_walking || m_chain.hasEnded())
+    // The customer may have stopped or left while the message was sent.
+    if (m_phase != Phase::Walking)
         return;
-    m_walk.begin(m_platform.clock.now());
+    m_walk.take(m_platform.clock.now());
     Timer3.start();
     showWalk();
 }
 
-void MoogMeret::Timer3_Tick() {
-    Command12_Click();
-}
-
-void MoogMeret::Command12_Click() {
-    if (m_sending)
+void MoogMeret::stepWalk() {
+    if (sending())
         return;
     const QDateTime now = m_platform.clock.now();
-    const QString time = now.toString(QStringLiteral("HH:mm:ss"));
+    const QString time = now.toString(u"HH:mm:ss"_s);
     if (std::exchange(Label4Shaa.text, time) != time)
         Q_EMIT changed();
-    // Once it is over the clock alone goes on: a package that is picked from the list is sent by itself.
-    if (!m_walking)
+    // Once the walk is over the clock alone goes on.
+    if (m_phase != Phase::Walking)
         return;
-    switch (m_walk.step(List1.currentIndex(), List1.count(), now)) {
-    case PackageWalk::Step::Over:
-        Command2.visible = true;
+    const PackageWalk::Step step = m_walk.step(List1.currentIndex(), now);
+    if (step == PackageWalk::Step::Over)
         endWalk();
-        return;
-    case PackageWalk::Step::Next:
+    else if (step == PackageWalk::Step::Next)
         selectPackage(List1.currentIndex() + 1);
-        break;
-    case PackageWalk::Step::Wait:
-        break;
-    }
-    if (m_chain.hasEnded())
+    if (m_phase != Phase::Walking)
         return;
     m_walk.measure(m_platform.clock.now());
     showWalk();
 }
 
-void MoogMeret::Command19_Click() {
-    if (!m_walking)
+void MoogMeret::stopWalk() {
+    if (m_phase != Phase::Walking)
         return;
     Timer3.stop();
-    Command2.visible = true;
     endWalk();
 }
 
 // The selection stays where it is.
 void MoogMeret::endWalk() {
-    m_walking = false;
-    m_walked = true;
-    Command18.visible = Command28.visible = Command4Orders.visible = List1Shown.visible = true;
-    Command19.visible = Label24.visible = false;
+    enter(Phase::Walked);
     showOutcome();
-    Q_EMIT changed();
 }
 
-void MoogMeret::leaveWalk() {
-    m_walked = false;
-    Command18.visible = Command4Orders.visible = false;
-}
-
-void MoogMeret::Label13_Click() {
+void MoogMeret::clearMinutes() {
     m_walk.clearMinutes();
     showWalk();
 }
 
-void MoogMeret::List1_Click(int index) {
-    if (m_sending || m_walking || !List1Shown.enabled || index < 0 || index >= List1.count())
+void MoogMeret::pickPackage(int index) {
+    if (m_phase != Phase::Walked || sending() || index < 0 || index >= List1.count())
         return;
     // One that the server has taken is not sent twice; the one in hand is, when it has failed.
-    if (package(index) == Package::Sent)
+    if (m_walk.fate(index) == PackageWalk::Fate::Sent)
         List1.setCurrentIndex(index);
-    else if (index == List1.currentIndex() && package(index) == Package::Failed)
+    else if (index == List1.currentIndex() && m_walk.fate(index) == PackageWalk::Fate::Failed)
         sendPackage(index);
     else
         selectPackage(index);
     showOutcome();
-    Q_EMIT changed();
 }
 
 void MoogMeret::selectPackage(int index) {
@@ -158,16 +125,13 @@ void MoogMeret::selectPackage(int index) {
         sendPackage(index);
 }
 
-// Without a mail server there is no step: the walk shows each file for its time.
+// Without a mail server the walk shows each file for its time and sends nothing.
 void MoogMeret::sendPackage(int index) {
     if (!mailSetUp())
         return;
-    const auto at = static_cast<std::size_t>(index);
     const QString path = List1.item(index);
-    m_packages[at] = Package::Sending;
-    m_sending = true;
-    Label4Doar.text = m_state.wording(QStringLiteral("שולחים את המנה. נא להמתין."),
-                                      QStringLiteral("Sending the package. Please wait."));
+    m_walk.tell(index, PackageWalk::Fate::Sending);
+    Label4Doar.text = m_state.wording(u"שולחים את המנה. נא להמתין."_s, u"Sending the package. Please wait."_s);
     Label4Doar.hint.clear();
     Q_EMIT changed();
     const QString order = FolderOfPath(path);
@@ -177,51 +141,10 @@ void MoogMeret::sendPackage(int index) {
         outcome = m_platform.mail.send(m_state.profile.mail, {LeafName(order), letter, *file});
     else
         outcome = {MailEnd::AttachmentMissing, path};
-    m_sending = false;
-    m_packages[at] = outcome.end == MailEnd::Sent ? Package::Sent : Package::Failed;
+    m_walk.tell(index, outcome.end == MailEnd::Sent ? PackageWalk::Fate::Sent : PackageWalk::Fate::Failed);
     Label4Doar.text = MailResultText(MailResultCode(outcome.end), m_state.english()).trimmed();
     Label4Doar.hint = outcome.words;
-    if (!m_walking)
-        showOutcome();
-    Q_EMIT changed();
-}
-
-OrderDetails MoogMeret::detailsOf(const QString& folder) const {
-    OrderDetails details;
-    const QString text = OrderFolder(folder).logPath();
-    if (m_platform.files.fileExists(text))
-        ReadResentDetails(m_platform.files, text, details);
-    return details;
-}
-
-void MoogMeret::showWalk() {
-    Label13.text = QString::number(static_cast<int>(m_walk.minutes()));
-    Label4Mana.text = m_state.wording(QStringLiteral("מנה %1 מתוך %2"), QStringLiteral("Package %1 of %2"))
-                          .arg(List1.currentIndex() + 1)
-                          .arg(List1.count());
-    Label4Shem.text = List1.currentIndex() < 0 ? QString() : LeafName(List1.currentItem());
-    Q_EMIT changed();
-}
-
-void MoogMeret::showOutcome() {
-    const auto sent = std::count(m_packages.begin(), m_packages.end(), Package::Sent);
-    if (!m_walked || !mailSetUp()) {
-        Label4Sof.text.clear();
-    } else if (sent == List1.count()) {
-        Label4Sof.text = m_state
-                             .wording(QStringLiteral("כל %1 המנות נשלחו בדואר."),
-                                      QStringLiteral("All %1 packages were sent by mail."))
-                             .arg(sent);
-    } else {
-        Label4Sof.text =
-            m_state
-                .wording(QStringLiteral("נשלחו %1 מתוך %2 מנות. כל הקבצים שמורים במחשב זה. כדי לשלוח מנה שלא נשלחה יש "
-                                        "ללחוץ עליה ברשימה."),
-                         QStringLiteral("%1 of %2 packages were sent. All files are kept on this computer. Press a "
-                                        "package that was not sent to send it."))
-                .arg(sent)
-                .arg(List1.count());
-    }
+    showOutcome();
 }
 
 } // namespace lumora

@@ -6,6 +6,7 @@
 #include "order/PieceName.h"
 #include "platform/files/Files.h"
 
+#include <QHash>
 #include <QSet>
 
 #include <algorithm>
@@ -203,6 +204,27 @@ int CollectFamily(const TextList& families, const TextList& pieces, TextList& fa
             family.append(path);
     }
     return FamilyVerdict(DeclaredTotal(single), family.count());
+}
+
+std::vector<PieceFamily> JudgeFamilies(const TextList& singles, const TextList& pieces) {
+    QHash<QString, int> counts;
+    QSet<QString> paths;
+    QSet<QString> twice;
+    for (const QString& path : pieces.items()) {
+        const QString key = FamilyKey(path);
+        ++counts[key];
+        if (paths.contains(path))
+            twice.insert(key);
+        paths.insert(path);
+    }
+    std::vector<PieceFamily> families;
+    for (const QString& first : singles.items()) {
+        const QString key = FamilyKey(first);
+        const int declared = DeclaredTotal(first);
+        const int count = counts.value(key);
+        families.push_back({first, declared, count, FamilyVerdict(declared, count), twice.contains(key)});
+    }
+    return families;
 }
 
 int FamilyVerdict(int declared, int count) {

@@ -9,6 +9,7 @@
 #include <cstdint>
 #include <functional>
 #include <optional>
+#include <vector>
 
 namespace lumora {
 
@@ -77,6 +78,17 @@ int CollectFamily(const TextList& families, const TextList& pieces, TextList& fa
 int FamilyVerdict(int declared, int count);
 inline constexpr int familyComplete = 1;
 inline constexpr int surplusBase = 10;
+
+// What is known of a family.
+struct PieceFamily {
+    QString first; // path of its first listed piece
+    int declared = 0;
+    int count = 0;
+    int verdict = 0;          // as CollectFamily's
+    bool listedTwice = false; // a path stands more than once in pieces: its folder was read again
+};
+// One for each entry of singles.
+std::vector<PieceFamily> JudgeFamilies(const TextList& singles, const TextList& pieces);
 
 // The total that a piece's name declares; 0 for what is no number.
 int DeclaredTotal(const QString& piecePath);

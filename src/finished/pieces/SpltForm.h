@@ -4,9 +4,6 @@
 #include "platform/files/Files.h"
 #include "session/Caption.h"
 #include "session/Page.h"
-#include "session/TextList.h"
-
-#include <vector>
 
 namespace lumora {
 
@@ -14,101 +11,140 @@ class PageChain;
 struct Platform;
 struct SessionState;
 
-// The operator's page of pieces: cuts the files of a folder into pieces that a slow line can carry, and joins families
-// of pieces into the file again. It works on any folder, reads what it is given and writes beside it. Long work yields
-// between two pieces, and can be stopped there.
-class SpltForm : public Page {
+struct SpltFormControls : Controls {
+    Caption Title{*this, u"Title"};
+
+    Caption Label4Cut{*this, u"Label4Cut"}; // head of what is cut
+    Caption Command2{*this, u"Command2"};   // choose the folder of the files to cut
+    Caption Label4files{*this, u"Label4files"};
+    TextList List4files{*this, u"List4files"}; // files to cut, full paths
+    Caption Label4Text2{*this, u"Label4Text2"};
+    Caption Text2{*this, u"Text2"};       // size of a piece in bytes, as it was written
+    Caption Command3{*this, u"Command3"}; // "Split All"
+    Caption Command9{*this, u"Command9"}; // "splitOne"
+
+    Caption Label4Join{*this, u"Label4Join"};     // head of what is joined
+    Caption Command8{*this, u"Command8"};         // reads a folder of pieces
+    Caption Label1{*this, u"Label1"};             // count of ListChalakim
+    Caption Label5{*this, u"Label5"};             // count of List4Bodedim
+    Caption Label4Counts{*this, u"Label4Counts"}; // both in words; empty before a folder was read
+    Caption Label4Bodedim{*this, u"Label4Bodedim"};
+    TextList List4Bodedim{*this, u"List4Bodedim"}; // of each family its first listed piece
+    Caption Label4Famely{*this, u"Label4Famely"};
+    TextList List4Famely{*this, u"List4Famely"}; // the pieces of the family in hand
+    Caption Label4Chalakim{*this, u"Label4Chalakim"};
+    TextList ListChalakim{*this, u"ListChalakim"};             // every file of the folders read so far, full paths
+    Caption Label8{*this, u"Label8"};                          // length of the chosen file in bytes
+    Caption Label9{*this, u"Label9"};                          // its drive, "C:"
+    Caption Label4Length{*this, u"Label4Length"};              // both in words; empty before a length was asked for
+    Caption Command1{*this, u"Command1"};                      // "MergeAll"
+    Caption Command4{*this, u"Command4"};                      // "Merge"
+    Caption Command5{*this, u"Command5", Caption::At::Hidden}; // "Find Famely", without effect
+    Caption Command6{*this, u"Command6"};                      // "Filelen"
+
+    Caption Label4Idle{*this, u"Label4Idle"};   // what the page is for
+    Caption Label4Work{*this, u"Label4Work"};   // what is in hand
+    Caption Label4Total{*this, u"Label4Total"}; // what came of it
+    Caption Label4Where{*this, u"Label4Where"}; // the folder where the result lies
+    Caption Command15{*this, u"Command15"};     // stop
+    Caption Image3{*this, u"Image3"};           // back
+};
+
+// The page of pieces (SpltForm, Mod4split): the lab's operator cuts the files of a folder into pieces that a slow line
+// can carry, and joins families of pieces into the file again. It works on any folder, reads what it is given and
+// writes beside it. Long work yields between two pieces, and can be stopped there.
+class SpltForm : public Page, private SpltFormControls {
     Q_OBJECT
 public:
     SpltForm(SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;
 
-    // Events.
-    void Text2_Change(const QString& text); // the segment
-    void Command2_Click();                  // choose the folder of the files to cut
-    void Command3_Click();                  // "Split All"
-    void Command9_Click();                  // "splitOne"
-    void Command8_Click();                  // adds the files of a folder, and of those below it, to the pieces
-    void Command1_Click();                  // "MergeAll"
-    void Command4_Click();                  // "Merge": the chosen family, complete or not
-    void Command6_Click();                  // "Filelen" of the chosen file
-    void Command5_Click() {}                // "Find Famely": never did anything
-    void List4Bodedim_Click(int index);
-    void ListChalakim_Click(int index);
-    void Command15_Click(); // stop
-    void Image3_Click();    // back to the finished orders; work under way ends first
+    // --- events ---
 
-    // State.
-    Caption Text2;
-    TextList List4files;   // files to cut, full paths
-    TextList ListChalakim; // every file of the folders read so far, full paths
-    TextList List4Bodedim; // of each family its first listed piece
-    TextList List4Famely;  // the pieces of the family in hand
-    Caption Command1;
-    Caption Command2;
-    Caption Command3;
-    Caption Command4;
-    Caption Command5;
-    Caption Command6;
-    Caption Command8;
-    Caption Command9;
-    Caption Command15;
-    Caption Image3;
-    Caption Label1;      // count of ListChalakim
-    Caption Label5;      // count of List4Bodedim
-    Caption Label8;      // length of the chosen file in bytes
-    Caption Label9;      // its drive, "C:"
-    Caption Label4Text2; // "size of a piece, in bytes"
-    Caption Label4Work;  // what is in hand; empty while nothing is
-    Caption Label4Total; // what came of it
-    Caption Label4Where; // the folder where the result lies, else empty
+    void Text2_Change(const QString& text) { Text2.text = text; }
+    void Command2_Click() { chooseFilesToCut(); }
+    void Command3_Click() { cutAll(); }
+    void Command9_Click() { cutOne(); }
+    void Command8_Click() { addPieces(); }
+    void Command1_Click() { joinAll(); }
+    void Command4_Click() { joinChosen(); }
+    void Command6_Click() { showLengthOfChosen(); }
+    void List4Bodedim_Click(int index) { chooseFamily(index); }
+    void ListChalakim_Click(int index) { choosePiece(index); }
+    void Command15_Click() { m_stop = true; }
+    void Image3_Click() { goBack(); } // work under way ends first
 
-    // What is known of each entry of List4Bodedim.
-    struct Family {
-        int declared = 0;
-        int count = 0;
-        int verdict = 0;
-        bool listedTwice = false; // the same path more than once: its folder was read again
-        enum class Fate { Listed, Joined, JoinedShort, Failed } fate = Fate::Listed;
+    // --- state ---
+
+    enum class Phase { Idle, Working, Good, Partly, Failed }; // the last three: what came of the work
+    Phase phase() const { return m_phase; }
+    const SpltFormControls& controls() const override { return *this; }
+    int percent() const { return m_percent; } // of the work in hand
+    // An entry of List4Bodedim as a person reads it.
+    struct FamilyRow {
+        QString name;
+        QString words;
+        bool good;
     };
-    std::vector<Family> families;
-    // In words for a person.
-    QString familyWords(int index) const;
+    FamilyRow familyRow(int index) const;
 
-    enum class Outcome { None, Good, Partly, Failed };
-    Outcome outcome = Outcome::None;
-    bool busy = false;
-    int percent = 0; // of the work in hand
-
-    // The signal is Page::changed().
+    // What it tells: changed().
 
 private:
-    QString wording(const QString& hebrew, const QString& english) const;
+    // What came of the files or families of one piece of work.
+    struct Tally {
+        int done = 0;
+        int pieces = 0;
+        int passedOver = 0;
+        int failed = 0;
+    };
+    enum class Fate { Listed, Joined, JoinedShort, Failed };
+
+    void chooseFilesToCut();
+    void cutAll();
+    void cutOne();
+    void addPieces();
+    void joinAll();
+    void joinChosen();
+    void showLengthOfChosen();
+    void chooseFamily(int index);
+    void choosePiece(int index);
+    void goBack();
+    void leave();
+
     QString pickFile();
     QStringList collect(const QString& folder, Files::Depth depth);
-    void judgeFamilies();
-    void showWhatCanBeDone();
-
     bool segmentIsRight();
-    void begin();
-    void forgetOutcome();
-    void workOn(const QString& path, int index, int count);
-    bool step(int done, int total);
-    void end(Outcome result, const QString& total, const QString& where);
     Cut cut(const QString& path, const QString& extension);
     Joined join(int index);
-    QString reason(const Failure& failure) const;
+
+    void enter(Phase phase);
+    void begin();
+    void workOn(const QString& path, int index, int count);
+    bool step(int done, int total);
+    void end(Phase result, const QString& total, const QString& where);
     void tellTroubles();
-    void leave();
+
+    QString wording(const QString& hebrew, const QString& english) const;
+    void showCounts();
+    QString cutTotal(const Tally& tally) const;
+    QString joinTotal(const Tally& tally) const;
+    QString notCut(const QString& path, const Cut& result) const;
+    QString notJoined(const QString& path, const Failure& failure) const;
+    QString reason(const Failure& failure) const;
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     Mod4split m_pieces;
+    std::vector<PieceFamily> m_families; // of List4Bodedim
+    std::vector<Fate> m_fates;
+    Phase m_phase = Phase::Idle;
     QString m_folder; // where the last file was picked
     int m_index = 0;  // of the file or family in hand
     int m_count = 0;
+    int m_percent = 0;
     QStringList m_troubles; // of the work in hand
     bool m_stop = false;
     bool m_leaving = false;

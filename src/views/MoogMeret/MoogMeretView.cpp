@@ -57,16 +57,16 @@ QString MoogMeretView::orderRow(const QString& folderName) const {
 QWidget* MoogMeretView::makeOrders() {
     const auto [card, column] = makeCard("card", Pad::Normal);
     m_ordersCard = card;
-    column->addWidget(label(u"Label4Shalav1"_s, m_page.Label4Shalav1, "strong"));
+    column->addWidget(label(u"Label4Shalav1"_s, c.Label4Shalav1, "strong"));
     m_orders = new QListWidget(card);
     m_orders->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     whenPicked(m_orders, [&page = m_page](int row) { page.List3_Click(row); });
-    bindList(u"List3"_s, m_page.List3, m_orders, [this](const QString& name) { return orderRow(name); });
+    bindList(u"List3"_s, c.List3, m_orders, [this](const QString& name) { return orderRow(name); });
     column->addWidget(m_orders, 1);
     column->addWidget(button(
-        u"Command5"_s, m_page.Command5, Role::Plain, [this] { m_page.Command5_Click(); }, u"resend"_s));
+        u"Command5"_s, c.Command5, Role::Plain, [this] { m_page.Command5_Click(); }, u"resend"_s));
     column->addWidget(button(
-        u"Command4Pieces"_s, m_page.Command4Pieces, Role::Plain, [this] { m_page.Command4Pieces_Click(); },
+        u"Command4Pieces"_s, c.Command4Pieces, Role::Plain, [this] { m_page.Command4Pieces_Click(); },
         u"layers"_s));
     return card;
 }
@@ -81,7 +81,7 @@ QWidget* MoogMeretView::makeHint() {
     sign->setPixmap(theme().icon(u"pictures"_s, theme().px(96), Theme::Colour::Edge));
     column->addWidget(sign, 0, Qt::AlignCenter);
     for (QLabel* text :
-         {label(u"Label4Rek"_s, m_page.Label4Rek, "large"), label(u"Label4Bhar"_s, m_page.Label4Bhar, "large")}) {
+         {label(u"Label4Rek"_s, c.Label4Rek, "large"), label(u"Label4Bhar"_s, c.Label4Bhar, "large")}) {
         text->setAlignment(Qt::AlignCenter);
         column->addWidget(text);
     }
@@ -93,10 +93,10 @@ QWidget* MoogMeretView::makeFiles() {
     // The messages call it the yellow window.
     const auto [card, column] = makeCard("notice", Pad::Normal);
     m_files = card;
-    bind(u"Picture2"_s, m_files, m_page.Picture2);
-    column->addWidget(label(u"Label4Shalav2"_s, m_page.Label4Shalav2, "strong"));
-    column->addWidget(label(u"Label4Lakoach"_s, m_page.Label4Lakoach));
-    column->addWidget(label(u"Label4Reka"_s, m_page.Label4Reka, "danger"));
+    bind(u"Picture2"_s, m_files, c.Picture2);
+    column->addWidget(label(u"Label4Shalav2"_s, c.Label4Shalav2, "strong"));
+    column->addWidget(label(u"Label4Lakoach"_s, c.Label4Lakoach));
+    column->addWidget(label(u"Label4Reka"_s, c.Label4Reka, "danger"));
     m_fileList = new QListWidget(card);
     m_fileList->setTextElideMode(Qt::ElideMiddle);
     m_fileList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -104,13 +104,13 @@ QWidget* MoogMeretView::makeFiles() {
     bindList(u"File1"_s, m_page.File1.names(), m_fileList, [](const QString& name) { return fromLeft(name); });
     column->addWidget(m_fileList, 1);
     m_counts = makeLabel(card, "muted");
-    bind(u"Label5"_s, m_counts, [this] { return m_page.Label5.text; });
+    bind(u"Label5"_s, m_counts, [this] { return c.Label5.text; });
     column->addWidget(m_counts);
-    column->addWidget(label(u"Label4Pieces"_s, m_page.Label4Pieces, "smallMuted"));
+    column->addWidget(label(u"Label4Pieces"_s, c.Label4Pieces, "smallMuted"));
     column->addWidget(button(
-        u"Command1"_s, m_page.Command1, Role::Plain, [this] { m_page.Command1_Click(); }, u"tick"_s));
+        u"Command1"_s, c.Command1, Role::Plain, [this] { m_page.Command1_Click(); }, u"tick"_s));
     column->addWidget(button(
-        u"Command21"_s, m_page.Command21, Role::Plain, [this] { m_page.Command21_Click(); }, u"undo"_s));
+        u"Command21"_s, c.Command21, Role::Plain, [this] { m_page.Command21_Click(); }, u"undo"_s));
     return card;
 }
 
@@ -124,19 +124,19 @@ QWidget* MoogMeretView::makeWays() {
     connect(m_preview, &ScrolledPicture::movedAcross, this, [this](int steps) { m_page.HScroll1_Change(steps); });
     connect(m_preview, &ScrolledPicture::movedDown, this, [this](int steps) { m_page.VScroll1_Change(steps); });
     bind(u"Picture1"_s, m_preview,
-         [this] { return u"%1 x %2"_s.arg(m_page.Picture1.width()).arg(m_page.Picture1.height()); });
+         [this] { return u"%1 x %2"_s.arg(c.Picture1.width()).arg(c.Picture1.height()); });
     column->addWidget(m_preview);
     m_end = new Gauge(theme(), m_ways);
     m_end->setFixedSize(theme().px(180), theme().px(180));
     column->addStretch(1);
     column->addWidget(m_end, 0, Qt::AlignCenter);
     column->addStretch(1);
-    m_pickFirst = label(u"Label4Shalav3"_s, m_page.Label4Shalav3, "strong");
+    m_pickFirst = label(u"Label4Shalav3"_s, c.Label4Shalav3, "strong");
     column->addWidget(m_pickFirst);
     column->addWidget(button(
-        u"Command4"_s, m_page.Command4, Role::Main, [this] { m_page.Command4_Click(); }, u"send"_s));
+        u"Command4"_s, c.Command4, Role::Main, [this] { m_page.Command4_Click(); }, u"send"_s));
     column->addWidget(button(
-        u"Command2"_s, m_page.Command2, Role::Secondary, [this] { m_page.Command2_Click(); }, u"mail"_s));
+        u"Command2"_s, c.Command2, Role::Secondary, [this] { m_page.Command2_Click(); }, u"mail"_s));
     m_ways->setFixedWidth(m_preview->width());
     return m_ways;
 }
@@ -153,11 +153,11 @@ QWidget* MoogMeretView::makeWalk() {
     };
     m_gauge = new Gauge(theme(), m_walk);
     column->addWidget(m_gauge, 3, Qt::AlignCenter);
-    m_inHand = centred(label(u"Label4Mana"_s, m_page.Label4Mana, "large"));
-    m_nameInHand = centred(label(u"Label4Shem"_s, m_page.Label4Shem, "muted"));
+    m_inHand = centred(label(u"Label4Mana"_s, c.Label4Mana, "large"));
+    m_nameInHand = centred(label(u"Label4Shem"_s, c.Label4Shem, "muted"));
     m_parts = centred(makeLabel(m_walk, "body"));
     m_minutes = button(
-        u"Label13"_s, m_page.Label13, Role::Plain, [this] { m_page.Label13_Click(); }, u"clock"_s);
+        u"Label13"_s, c.Label13, Role::Plain, [this] { m_page.Label13_Click(); }, u"clock"_s);
     column->addWidget(m_minutes, 0, Qt::AlignCenter);
 
     const auto [answer, words] = makeCard("card", Pad::Normal);
@@ -167,8 +167,8 @@ QWidget* MoogMeretView::makeWalk() {
     m_answerSign = new QLabel(answer);
     row->addWidget(m_answerSign, 0, Qt::AlignTop);
     auto* texts = new QVBoxLayout;
-    texts->addWidget(label(u"Label4Sof"_s, m_page.Label4Sof, "strong"));
-    texts->addWidget(label(u"Label4Doar"_s, m_page.Label4Doar));
+    texts->addWidget(label(u"Label4Sof"_s, c.Label4Sof, "strong"));
+    texts->addWidget(label(u"Label4Doar"_s, c.Label4Doar));
     row->addLayout(texts, 1);
     words->addLayout(row);
     column->addWidget(answer);
@@ -176,38 +176,38 @@ QWidget* MoogMeretView::makeWalk() {
     m_packages = new QListWidget(m_walk);
     m_packages->setTextElideMode(Qt::ElideMiddle);
     whenPicked(m_packages, [&page = m_page](int at) { page.List1_Click(at); });
-    bindList(u"List1"_s, m_page.List1, m_packages, [](const QString& path) { return fromLeft(LeafName(path)); });
+    bindList(u"List1"_s, c.List1, m_packages, [](const QString& path) { return fromLeft(LeafName(path)); });
     column->addWidget(m_packages, 4);
-    centred(label(u"Label24"_s, m_page.Label24, "muted"));
+    centred(label(u"Label24"_s, c.Label24, "muted"));
     return m_walk;
 }
 
 void MoogMeretView::makeBars() {
     frame().addHeaderAction(button(
-        u"Command6"_s, m_page.Command6, Role::Quiet, [this] { m_page.Command6_Click(); }, u"exit"_s));
+        u"Command6"_s, c.Command6, Role::Quiet, [this] { m_page.Command6_Click(); }, u"exit"_s));
     frame().addSecondaryAction(button(
-        u"Command28"_s, m_page.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }, u"home"_s));
+        u"Command28"_s, c.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }, u"home"_s));
     frame().addSecondaryAction(
-        button(u"Command18"_s, m_page.Command18, Role::Secondary, [this] { m_page.Command18_Click(); }));
-    m_time = label(u"Label4Shaa"_s, m_page.Label4Shaa, "large");
+        button(u"Command18"_s, c.Command18, Role::Secondary, [this] { m_page.Command18_Click(); }));
+    m_time = label(u"Label4Shaa"_s, c.Label4Shaa, "large");
     frame().addStatus(m_time);
     frame().addMainAction(
-        button(u"Command4Orders"_s, m_page.Command4Orders, Role::Main, [this] { m_page.Command4Orders_Click(); }));
+        button(u"Command4Orders"_s, c.Command4Orders, Role::Main, [this] { m_page.Command4Orders_Click(); }));
     frame().addMainAction(button(
-        u"Command19"_s, m_page.Command19, Role::Secondary, [this] { m_page.Command19_Click(); }, u"stop"_s));
+        u"Command19"_s, c.Command19, Role::Secondary, [this] { m_page.Command19_Click(); }, u"stop"_s));
 }
 
 void MoogMeretView::bindTheRest() {
     const std::pair<const char*, const Caption*> captions[] = {
-        {"Title", &m_page.Title},         {"Picture3", &m_page.Picture3},       {"Label1", &m_page.Label1},
-        {"Label2", &m_page.Label2},       {"Label3", &m_page.Label3},           {"Label9", &m_page.Label9},
-        {"Label7", &m_page.Label7},       {"Label10", &m_page.Label10},         {"Label20", &m_page.Label20},
-        {"Label23", &m_page.Label23},     {"Label4Files", &m_page.Label4Files}, {"Label4Prints", &m_page.Label4Prints},
-        {"Command13", &m_page.Command13}, {"Label4Dakot", &m_page.Label4Dakot}};
+        {"Title", &c.Title},         {"Picture3", &c.Picture3},       {"Label1", &c.Label1},
+        {"Label2", &c.Label2},       {"Label3", &c.Label3},           {"Label9", &c.Label9},
+        {"Label7", &c.Label7},       {"Label10", &c.Label10},         {"Label20", &c.Label20},
+        {"Label23", &c.Label23},     {"Label4Files", &c.Label4Files}, {"Label4Prints", &c.Label4Prints},
+        {"Command13", &c.Command13}, {"Label4Dakot", &c.Label4Dakot}};
     for (const auto& [name, caption] : captions)
         bindHidden(QString::fromLatin1(name), *caption);
-    bindList(u"Dir1"_s, m_page.Dir1);
-    bindList(u"List2"_s, m_page.List2);
+    bindList(u"Dir1"_s, c.Dir1);
+    bindList(u"List2"_s, c.List2);
 }
 
 QWidget* MoogMeretView::firstFocus() const {
@@ -216,10 +216,10 @@ QWidget* MoogMeretView::firstFocus() const {
 
 void MoogMeretView::render() {
     const bool walk = m_page.walkShown();
-    const bool picked = m_page.Picture2.visible && !walk;
-    frame().setTitle(m_page.Title.text, m_page.Label23.text);
-    m_ordersCard->setVisible(m_page.Picture3.visible && !walk);
-    m_hint->setVisible(!m_page.Picture2.visible && !walk);
+    const bool picked = c.Picture2.visible && !walk;
+    frame().setTitle(c.Title.text, c.Label23.text);
+    m_ordersCard->setVisible(c.Picture3.visible && !walk);
+    m_hint->setVisible(!c.Picture2.visible && !walk);
     m_files->setVisible(picked);
     m_walk->setVisible(walk);
     m_ways->setVisible(picked || (walk && !m_page.walking()));
@@ -227,14 +227,14 @@ void MoogMeretView::render() {
     m_pickFirst->setVisible(picked);
     m_end->setVisible(walk);
     m_time->setVisible(walk);
-    if (m_page.List3.currentIndex() < 0 && m_orders->count() > 0)
+    if (c.List3.currentIndex() < 0 && m_orders->count() > 0)
         m_orders->scrollToBottom(); // the latest order
-    m_orders->setAccessibleName(m_page.Label4Shalav1.text);
+    m_orders->setAccessibleName(c.Label4Shalav1.text);
     const int size = theme().px(24);
     m_orders->setIconSize({size, size});
     for (int row = 0; row < m_orders->count(); ++row) {
         QListWidgetItem* item = m_orders->item(row);
-        const bool inPieces = TravelsInPieces(m_page.List3.item(row));
+        const bool inPieces = TravelsInPieces(c.List3.item(row));
         item->setIcon(theme().icon(inPieces ? u"layers"_s : u"pictures"_s, size, Theme::Colour::Primary));
         item->setToolTip(inPieces ? wording(u"הזמנה בחלקים"_s, u"An order in pieces"_s) : QString());
     }
@@ -251,18 +251,18 @@ void MoogMeretView::renderFiles() {
         item->setFont(theme().font(Theme::Type::Small));          // a name says much, and its end most
         item->setCheckState(m_page.File1.isMarked(row) ? Qt::Checked : Qt::Unchecked);
     }
-    m_fileList->setAccessibleName(m_page.Label4Shalav2.text);
-    m_counts->setText(isolated(m_page.Label1.text + u' ' + m_page.Label4Files.text + u'\n' + m_page.Label5.text + u' ' +
-                               m_page.Label4Prints.text));
-    m_preview->setPicture(m_page.Picture1.image());
-    m_preview->setScroll({m_page.HScroll1.value, m_page.VScroll1.value}, {m_page.HScroll1.max, m_page.VScroll1.max});
+    m_fileList->setAccessibleName(c.Label4Shalav2.text);
+    m_counts->setText(isolated(c.Label1.text + u' ' + c.Label4Files.text + u'\n' + c.Label5.text + u' ' +
+                               c.Label4Prints.text));
+    m_preview->setPicture(c.Picture1.image());
+    m_preview->setScroll({c.HScroll1.value, c.VScroll1.value}, {c.HScroll1.max, c.VScroll1.max});
     m_preview->setAccessibleName(wording(u"תצוגה של הקובץ הראשון"_s, u"A look at the first file"_s));
 }
 
 void MoogMeretView::renderWalk() {
     const bool walking = m_page.walking();
-    const int count = m_page.List1.count();
-    const int index = m_page.List1.currentIndex();
+    const int count = c.List1.count();
+    const int index = c.List1.currentIndex();
     bool failed = false;
     int sent = 0;
     for (int i = 0; i < count; ++i) {
@@ -270,28 +270,28 @@ void MoogMeretView::renderWalk() {
         sent += m_page.package(i) == MoogMeret::Package::Sent ? 1 : 0;
     }
     m_gauge->setVisible(walking);
-    const double ofPackage = std::min(m_page.Label13.text.toInt(), 3) / 3.0;
+    const double ofPackage = std::min(c.Label13.text.toInt(), 3) / 3.0;
     m_gauge->show(count == 0 ? 0 : (index + ofPackage) / count, u"%1 / %2"_s.arg(index + 1).arg(count),
-                  m_page.Label3.text);
+                  c.Label3.text);
     // Where nothing is sent the ring tells how far the walk came.
-    const int done = m_page.Label4Sof.text.isEmpty() ? index + 1 : sent;
+    const int done = c.Label4Sof.text.isEmpty() ? index + 1 : sent;
     if (failed)
         m_end->showSign(Gauge::Mood::Bad);
     else if (sent > 0 && sent == count)
         m_end->showSign(Gauge::Mood::Good);
     else
-        m_end->show(count == 0 ? 0 : double(done) / count, u"%1 / %2"_s.arg(done).arg(count), m_page.Label3.text);
+        m_end->show(count == 0 ? 0 : double(done) / count, u"%1 / %2"_s.arg(done).arg(count), c.Label3.text);
     m_inHand->setVisible(walking);
     m_nameInHand->setVisible(walking);
     m_parts->setVisible(walking);
-    m_parts->setText(isolated(m_page.Label9.text + u'\n' + m_page.Label2.text + u' ' + QString::number(count) + u' ' +
-                              m_page.Label3.text));
+    m_parts->setText(isolated(c.Label9.text + u'\n' + c.Label2.text + u' ' + QString::number(count) + u' ' +
+                              c.Label3.text));
     m_minutes->setVisible(walking);
-    m_minutes->setText(m_page.Label4Dakot.text + u' ' + m_page.Label13.text);
+    m_minutes->setText(c.Label4Dakot.text + u' ' + c.Label13.text);
     speak(m_minutes, m_minutes->text());
 
     const bool sending = m_page.sending();
-    m_answer->setVisible(!m_page.Label4Doar.text.isEmpty() || !m_page.Label4Sof.text.isEmpty());
+    m_answer->setVisible(!c.Label4Doar.text.isEmpty() || !c.Label4Sof.text.isEmpty());
     // Good is what the server has taken, be it the package in hand or, once the walk has ended, all of them.
     const bool good = !failed && (walking ? sent > 0 : sent > 0 && sent == count);
     changeRole(m_answer, sending ? "card" : failed ? "alarm" : good ? "success" : "notice");
@@ -304,9 +304,9 @@ void MoogMeretView::renderWalk() {
                                          : good && !sending ? Theme::Colour::Good
                                                             : Theme::Colour::Primary));
 
-    m_packages->setVisible(m_page.List1Shown.visible);
-    m_packages->setEnabled(m_page.List1Shown.enabled && !sending);
-    m_packages->setAccessibleName(m_page.Label3.text);
+    m_packages->setVisible(c.List1Shown.visible);
+    m_packages->setEnabled(c.List1Shown.enabled && !sending);
+    m_packages->setAccessibleName(c.Label3.text);
     const int size = theme().px(24);
     for (int row = 0; row < m_packages->count(); ++row) {
         const MoogMeret::Package is = m_page.package(row);

@@ -1,0 +1,29 @@
+// Events of the page of finished orders that stand in the page's description and come from no control that anybody
+// sees. The page's own code calls the verbs.
+#include "finished/orders/MoogMeret.h"
+
+namespace lumora {
+
+void MoogMeret::Command3_Click() {
+    if (mayAct())
+        listOrderInHand();
+}
+
+void MoogMeret::Command12_Click() {
+    stepWalk();
+}
+
+void MoogMeret::Command13_Click() {
+    beginWalk();
+}
+
+void MoogMeret::Command20_Click() {
+    listPackages();
+}
+
+void MoogMeret::Dir1_Change(const QString& folder) {
+    if (mayAct())
+        openFolder(folder);
+}
+
+} // namespace lumora

@@ -1,0 +1,150 @@
+// The wording of the page of pieces, in both languages.
+#include "common/DrivePathText.h"
+#include "finished/pieces/SpltForm.h"
+#include "order/PieceName.h"
+#include "session/SessionState.h"
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+QString SpltForm::wording(const QString& hebrew, const QString& english) const {
+    return m_state.wording(hebrew, english);
+}
+
+void SpltForm::setTexts() {
+    const auto set = [this](Caption& control, const QString& hebrew, const QString& english) {
+        control.text = wording(hebrew, english);
+    };
+    const auto hint = [this](Caption& control, const QString& hebrew, const QString& english) {
+        control.hint = wording(hebrew, english);
+    };
+    set(Title, u"חיתוך קבצים לחלקים וצירופם"_s, u"Cutting files into pieces and joining them"_s);
+    set(Label4Cut, u"לחתוך"_s, u"Cut"_s);
+    set(Label4Join, u"לצרף"_s, u"Join"_s);
+    set(Label4files, u"הקבצים לחיתוך"_s, u"Files to cut"_s);
+    set(Label4Bodedim, u"משפחות"_s, u"Families"_s);
+    set(Label4Famely, u"חלקי המשפחה שנבחרה"_s, u"Pieces of the chosen family"_s);
+    set(Label4Chalakim, u"כל הקבצים שנקראו"_s, u"All the files read"_s);
+    set(Label4Text2, u"גודל חלק, בבתים"_s, u"Size of a piece, in bytes"_s);
+    set(Label4Idle, u"בחרו תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים."_s,
+        u"Choose a folder to cut, or a folder of pieces to join. The files themselves never change."_s);
+    Command1.text = u"MergeAll"_s;
+    set(Command2, u"בחר תיקייה לחיתוך"_s, u"Choose a folder to cut"_s);
+    Command3.text = u"Split All"_s;
+    Command4.text = u"Merge"_s;
+    Command5.text = u"Find Famely"_s;
+    Command6.text = u"Filelen"_s;
+    set(Command8, u"קרא תיקיית חלקים"_s, u"Read a folder of pieces"_s);
+    Command9.text = u"splitOne"_s;
+    set(Command15, u"עצור"_s, u"Stop"_s);
+    set(Image3, u"חזרה להזמנות המוגמרות"_s, u"Back to the finished orders"_s);
+    hint(Command3, u"חותך את כל קובצי jpp שברשימה"_s, u"Cuts all the jpp files of the list"_s);
+    hint(Command9, u"חותך קובץ prk אחד"_s, u"Cuts one prk file"_s);
+    hint(Command1, u"מצרף את כל המשפחות השלמות"_s, u"Joins all the complete families"_s);
+    hint(Command4, u"מצרף את המשפחה שנבחרה, גם אם אינה שלמה"_s,
+         u"Joins the chosen family, even if it is not complete"_s);
+    hint(Command6, u"אורך הקובץ שנבחר"_s, u"Length of the chosen file"_s);
+    showCounts();
+    Q_EMIT changed();
+}
+
+void SpltForm::showCounts() {
+    if (!Label1.text.isEmpty())
+        Label4Counts.text =
+            wording(u"קבצים: %1 · משפחות: %2"_s, u"Files: %1 · families: %2"_s).arg(Label1.text, Label5.text);
+    // The marks keep the drive's colon behind its letter.
+    Label4Length.text = Label8.text.isEmpty()
+                            ? QString()
+                            : wording(u"%1 בתים, כונן \u2066%2\u2069"_s, u"%1 bytes, drive \u2066%2\u2069"_s)
+                                  .arg(Label8.text, Label9.text);
+}
+
+SpltForm::FamilyRow SpltForm::familyRow(int index) const {
+    const PieceFamily& family = m_families.at(static_cast<std::size_t>(index));
+    const Fate fate = m_fates.at(static_cast<std::size_t>(index));
+    const QString leaf = LeafName(family.first);
+    FamilyRow row{JoinedName(leaf).value_or(leaf), {}, false};
+    if (fate == Fate::Joined) {
+        row.words = wording(u"צורפה"_s, u"Joined"_s);
+        row.good = true;
+    } else if (fate == Fate::JoinedShort) {
+        row.words = wording(u"צורפה, לא שלמה"_s, u"Joined, not complete"_s);
+    } else if (fate == Fate::Failed) {
+        row.words = wording(u"לא צורפה"_s, u"Not joined"_s);
+    } else if (family.verdict > familyComplete && family.listedTwice) {
+        row.words = wording(u"עודף: התיקייה נקראה יותר מפעם אחת"_s, u"Surplus: the folder was read more than once"_s);
+    } else {
+        row.good = family.verdict == familyComplete;
+        row.words =
+            (row.good                          ? wording(u"שלמה: %1 מתוך %2"_s, u"Complete: %1 of %2"_s)
+             : family.verdict < familyComplete ? wording(u"חסרה: %1 מתוך %2"_s, u"Short: %1 of %2"_s)
+                                               : wording(u"עודף: %1 במקום %2"_s, u"Surplus: %1 in place of %2"_s))
+                .arg(family.count)
+                .arg(family.declared);
+    }
+    return row;
+}
+
+QString SpltForm::cutTotal(const Tally& tally) const {
+    QString total =
+        wording(u"קבצים שנחתכו: %1, חלקים: %2."_s, u"Files cut: %1, pieces: %2."_s).arg(tally.done).arg(tally.pieces);
+    if (tally.passedOver > 0)
+        total +=
+            wording(u" קבצים שאינם jpp ולכן נותרו: %1."_s, u" Not jpp and left alone: %1."_s).arg(tally.passedOver);
+    if (tally.failed > 0)
+        total += wording(u" לא נחתכו עד הסוף: %1."_s, u" Not cut to the end: %1."_s).arg(tally.failed);
+    return total;
+}
+
+QString SpltForm::joinTotal(const Tally& tally) const {
+    QString total = wording(u"קבצים שצורפו: %1."_s, u"Files joined: %1."_s).arg(tally.done);
+    if (tally.passedOver > 0)
+        total += wording(u" משפחות שאינן שלמות ולא צורפו: %1."_s, u" Families not complete and passed over: %1."_s)
+                     .arg(tally.passedOver);
+    if (tally.failed > 0)
+        total += wording(u" לא ניתן היה לצרף: %1."_s, u" Could not be joined: %1."_s).arg(tally.failed);
+    return total;
+}
+
+QString SpltForm::notCut(const QString& path, const Cut& result) const {
+    const QString written = result.pieces == 0 ? wording(u"לא נכתב אף חלק"_s, u"No piece was written"_s)
+                                               : wording(u"חלקים שנכתבו: %1 מתוך %2"_s, u"Pieces written: %1 of %2"_s)
+                                                     .arg(result.pieces)
+                                                     .arg(result.declared);
+    return wording(u"%1 לא נחתך עד הסוף. %2; הקובץ עצמו לא השתנה."_s,
+                   u"%1 was not cut to its end. %2; the file itself is as it was."_s)
+               .arg(LeafName(path), written) +
+           u'\n' + reason(*result.failure);
+}
+
+QString SpltForm::notJoined(const QString& path, const Failure& failure) const {
+    return wording(u"%1 לא צורף. החלקים לא השתנו, ולא נותר קובץ חלקי."_s,
+                   u"%1 was not joined. The pieces are as they were, and no half file is left."_s)
+               .arg(LeafName(path)) +
+           u'\n' + reason(failure);
+}
+
+QString SpltForm::reason(const Failure& failure) const {
+    using enum Failure::Kind;
+    static constexpr struct {
+        Failure::Kind kind;
+        QStringView hebrew;
+        QStringView english;
+    } kinds[] = {
+        {NotFound, u"הקובץ או התיקייה אינם נמצאים:", u"The file or folder is not there:"},
+        {AccessDenied, u"אין הרשאה לקובץ או לתיקייה:", u"There is no right to the file or folder:"},
+        {NoSpace, u"אין די מקום בדיסק:", u"There is not enough room on the disk:"},
+        {TooLarge, u"גדול מדי; קובץ נחתך ל-999 חלקים לכל היותר:", u"Too large; a file is cut into 999 pieces at most:"},
+        {Unsupported, u"שם הקובץ אינו מתאים:", u"The name of the file does not fit:"},
+        {Damaged, u"הקובץ השתנה בזמן העבודה:", u"The file changed meanwhile:"},
+    };
+    QString words = wording(u"תקלה:"_s, u"A fault:"_s);
+    for (const auto& row : kinds) {
+        if (row.kind == failure.kind)
+            words = wording(row.hebrew.toString(), row.english.toString());
+    }
+    return words + u'\n' + failure.message;
+}
+
+} // namespace lumora

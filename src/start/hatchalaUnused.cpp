@@ -1,0 +1,128 @@
+// What the start page has to have and no step of the program comes to: the service panel, the countdown, and the fetch
+// of the advertising picture.
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "platform/Dialogs.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
+#include "session/PageChain.h"
+#include "session/Workspace.h"
+#include "session/lab/SettingsText.h"
+#include "start/hatchala.h"
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// A settings text is one line; what a stranger's server sends in its place may be anything.
+constexpr qint64 largestSettingsFile = 1 << 16;
+
+} // namespace
+
+void hatchala::showSender() {
+    m_chain.follow(PageId::hatchala, Outcome::SendingWanted);
+}
+
+void hatchala::StartAutomatically() {
+    startWith(u"PIC"_s);
+}
+
+void hatchala::countDown() {
+    if (m_secondsLeft >= 1) {
+        Label6.text = QString::number(--m_secondsLeft);
+        Label6.visible = Label7.visible = true;
+        Q_EMIT changed();
+        return;
+    }
+    m_timers.Timer4.stop();
+    m_timers.Timer4.setInterval(0);
+    StartAutomatically();
+}
+
+void hatchala::fetchPicture() {
+    m_timers.Timer1.stop();
+    // A picture that does not come is no loss: one that is there already shows all the same.
+    const auto target = m_platform.files.drives().toHost(m_state.profile.AdFile1);
+    if (target && Workspace(m_state, m_platform.files).MakeRootFolders())
+        (void)m_platform.internet.download(m_state.profile.AdUrl1, *target);
+    if (m_platform.files.fileExists(m_state.profile.AdFile1)) {
+        Picture4 = m_state.profile.AdFile1;
+        m_timers.Timer2.start();
+    }
+    Q_EMIT changed();
+}
+
+QString hatchala::settingsFile() const {
+    return JoinDrivePath(WorkspacePaths::root(m_state), m_state.profile.ClientCode + u".txt"_s);
+}
+
+void hatchala::BuildSettingsText() {
+    const QString text = SettingsText(m_state.profile);
+    const QString path = settingsFile();
+    if (const Result<void> written = m_platform.files.writeWhole(path, AnsiCodePage::encode(text) + "\r\n"); !written)
+        m_platform.dialogs.message(written.failure().message);
+    Label5.text = text;
+    SplitSettingsText(text);
+}
+
+void hatchala::SplitSettingsText(const QString& text) {
+    List4pices.clear();
+    List4pices.append(SplitSettings(text).pieces);
+    Q_EMIT changed();
+}
+
+void hatchala::DownloadSettings() {
+    const Workspace workspace(m_state, m_platform.files);
+    if (!workspace.MakeRootFolders())
+        return;
+    const QString path = settingsFile();
+    (void)m_platform.files.removeFile(path);
+    // The caller learns of a failure from the file that is missing then.
+    if (const auto target = m_platform.files.drives().toHost(path))
+        (void)m_platform.internet.download(
+            u"http://%1/00natoonim/%2.txt"_s.arg(m_state.profile.SettingsHost, m_state.profile.ClientCode), *target);
+}
+
+void hatchala::ReadSettingsFile(const QString& path) {
+    List2.clear();
+    const bool named = LeafName(path) == m_state.profile.ClientCode + u".txt"_s;
+    const Result<qint64> size = m_platform.files.size(path);
+    const Result<QByteArray> bytes = named && size && *size <= largestSettingsFile
+                                         ? m_platform.files.read(path)
+                                         : Result<QByteArray>(Failure{Failure::Kind::NotFound, {}});
+    if (!bytes) {
+        m_platform.dialogs.message(u"No Server"_s);
+        return;
+    }
+    QString text = AnsiCodePage::decode(*bytes);
+    text.replace(u"\r\n"_s, u"\n"_s);
+    if (text.endsWith(u'\n'))
+        text.chop(1);
+    if (!bytes->isEmpty())
+        List2.append(text.split(u'\n'));
+}
+
+void hatchala::fetchSettings() {
+    DownloadSettings();
+    ReadSettingsFile(settingsFile());
+    if (List2.isEmpty())
+        m_platform.dialogs.message(u"No Server 2"_s);
+    else
+        SplitSettingsText(List2.item(0));
+    Q_EMIT changed();
+}
+
+// Twice: the stored form is the text under the square of the substitution.
+void hatchala::scramble() {
+    Label5.text = Scramble(Scramble(Label5.text));
+    Q_EMIT changed();
+}
+
+void hatchala::unscramble() {
+    Label5.text = Unscramble(Unscramble(Label5.text));
+    Q_EMIT changed();
+}
+
+} // namespace lumora
