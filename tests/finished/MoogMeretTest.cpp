@@ -82,7 +82,8 @@ protected:
     // Index and minutes of the package in hand, or "over".
     std::string walk() {
         return page().phase() == MoogMeret::Phase::Walking
-                   ? (QString::number(page().controls().List1.currentIndex()) + u' ' + page().controls().Label13.text).toStdString()
+                   ? (QString::number(page().controls().List1.currentIndex()) + u' ' + page().controls().Label13.text)
+                         .toStdString()
                    : "over";
     }
 
@@ -120,7 +121,7 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
         EXPECT_EQ(page.controls().Label1.text, QString::number(c.files));
         EXPECT_EQ(page.controls().Label5.text, QString::number(c.pictures));
         EXPECT_EQ(state.shemot.TotalPics, c.pictures);
-        EXPECT_EQ(state.transfer.Mefurak, c.Mefurak);
+        EXPECT_EQ(state.transfer.Mefurak, static_cast<Travel>(c.Mefurak));
         EXPECT_EQ(page.controls().Label4Pieces.visible, c.Mefurak > 0);
         EXPECT_EQ(page.controls().Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order == pieces);
     }
@@ -177,12 +178,12 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
             page.Command21_Click();
         page.File1_Click(page.controls().File1.find(QString::fromLatin1(c.touched)));
         EXPECT_EQ(leaves(page.files().mailList()).toStdString(), c.mailed);
-        state.transfer.SugMishloah = 0;
+        state.transfer.SugMishloah = Sending::NewOrder;
         page.Command4_Click();
         ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
         EXPECT_EQ(leaves(state.handOver.lines).toStdString(), c.sent.toStdString());
         EXPECT_EQ(state.handOver.lines.value(0), in(c.order, c.order + u".txt"_s));
-        EXPECT_EQ(state.transfer.SugMishloah, 1);
+        EXPECT_EQ(state.transfer.SugMishloah, Sending::Resend);
         EXPECT_EQ(chain.find(PageId::MoogMeret), nullptr);
         chain.unload(PageId::FtpFrm);
     }
@@ -191,7 +192,7 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
     page.File1_Click(page.controls().File1.find(pieces + u".txt"_s));
     EXPECT_EQ(page.files().resendList().count(in(pieces, pieces + u".txt"_s)), 1);
 
-    state.transfer.SugSheliach = 1;
+    state.transfer.SugSheliach = Sender::Http;
     state.handOver.lines.clear();
     page.Command4_Click();
     EXPECT_EQ(chain.front()->id(), PageId::UploadForm);
@@ -208,7 +209,8 @@ TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
     EXPECT_EQ(marked(page), "!104_1234.jpp 02a.jpp 11b.JPG");
     EXPECT_EQ(leaves(page.controls().List1.items()), whole + u" !104_1234.jpp 02a.jpp 11b.JPG"_s);
     EXPECT_TRUE(state.handOver.lines.isEmpty());
-    for (const Caption* label : {&page.controls().Label23, &page.controls().Label20, &page.controls().Label10, &page.controls().Label7})
+    for (const Caption* label :
+         {&page.controls().Label23, &page.controls().Label20, &page.controls().Label10, &page.controls().Label7})
         EXPECT_EQ(label->text, u"Dana");
 }
 
@@ -249,7 +251,8 @@ TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
     MoogMeret& page = startWith(whole);
     test.clock.time = at("10:00:59");
     page.Command2_Click();
-    EXPECT_FALSE(page.controls().Command2.visible || page.controls().Command4.visible || page.controls().Command18.visible || page.List1Shown.visible);
+    EXPECT_FALSE(page.controls().Command2.visible || page.controls().Command4.visible ||
+                 page.controls().Command18.visible);
     EXPECT_TRUE(page.controls().Label24.visible && page.clockRuns());
     EXPECT_EQ(page.controls().Label4Mana.text, u"מנה 1 מתוך 3");
 
@@ -267,7 +270,8 @@ TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
         tick(c.time);
         EXPECT_EQ(walk(), c.walk) << c.time;
     }
-    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible && page.List1Shown.visible && page.clockRuns());
+    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible &&
+                page.phase() == MoogMeret::Phase::Walked && page.clockRuns());
     EXPECT_FALSE(page.controls().Label24.visible);
     EXPECT_EQ(page.controls().Label4Shaa.text, u"09:50:00") << "the timer runs on";
     EXPECT_TRUE(test.mail.messages.isEmpty()) << "no mail server is set up";
@@ -291,7 +295,8 @@ TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedTh
     page.Command19_Click();
     EXPECT_FALSE(page.clockRuns());
     EXPECT_EQ(page.controls().List1.currentIndex(), 1);
-    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible && page.List1Shown.visible);
+    EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible &&
+                page.phase() == MoogMeret::Phase::Walked);
 
     page.File1_Click(0);
     page.File1_Click(1);

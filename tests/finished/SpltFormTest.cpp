@@ -39,7 +39,8 @@ TEST_F(SpltFormTest, AFolderIsCutAndItsFamiliesAreJoinedAgain) {
     write(at("order.txt"), "not cut");
     EXPECT_EQ(page().controls().Text2.text, u"400000"_s);
     choose("order.txt", &SpltForm::Command2_Click);
-    EXPECT_EQ(page().controls().List4files.items(), QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
+    EXPECT_EQ(page().controls().List4files.items(),
+              QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
     page().Text2_Change(u"4"_s);
     page().Command3_Click();
     EXPECT_EQ(page().phase(), SpltForm::Phase::Good);

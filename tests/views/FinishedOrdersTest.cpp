@@ -69,26 +69,25 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     look(walk, u"61-orders"_s);
     const ControlFinder finder(walk.program().window());
     auto& page = walk.page<MoogMeret>(PageId::MoogMeret);
-    const QString whole = page.List3.item(page.List3.count() - 2);
+    const QString whole = page.controls().List3.item(page.controls().List3.count() - 2);
     ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"List3"_s, whole).ok());
     look(walk, u"62-picked"_s);
-    EXPECT_EQ(page.File1.markedCount(), 10);
+    EXPECT_EQ(page.files().markedCount(), 10);
     ASSERT_TRUE(finder.drag(u"MoogMeret"_s, u"Picture1"_s, {80, 80}, {10, 10}).ok());
-    EXPECT_GT(page.HScroll1.value, 0);
-    EXPECT_GT(page.VScroll1.value, 0);
+    EXPECT_GT(page.controls().HScroll1.value, 0);
+    EXPECT_GT(page.controls().VScroll1.value, 0);
     walk.press(u"MoogMeret"_s, u"Command21"_s);
-    ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"File1"_s, page.File1.names().item(2)).ok());
-    ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"File1"_s, page.File1.names().item(3)).ok());
-    EXPECT_EQ(page.File1.markedCount(), 2);
+    ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(2)).ok());
+    ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(3)).ok());
+    EXPECT_EQ(page.files().markedCount(), 2);
     look(walk, u"63-two-marked"_s);
 
     walk.press(u"MoogMeret"_s, u"Command2"_s);
-    page.Timer3.stop();
     look(walk, u"64-walk"_s);
     EXPECT_FALSE(walk.pressable(u"MoogMeret"_s, u"Command18"_s));
     walk.press(u"MoogMeret"_s, u"Command19"_s);
     look(walk, u"65-walk-ended"_s);
-    EXPECT_EQ(page.package(0), MoogMeret::Package::Failed);
+    EXPECT_EQ(page.walk().fate(0), PackageWalk::Fate::Failed);
     walk.press(u"MoogMeret"_s, u"Command4Orders"_s);
     // The operator's page leads back to the orders.
     walk.press(u"MoogMeret"_s, u"Command4Pieces"_s);
@@ -97,7 +96,7 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     walk.waitFor(u"MoogMeret"_s);
 
     ASSERT_TRUE(finder.choose(u"MoogMeret"_s, u"List3"_s, pieces).ok());
-    EXPECT_EQ(page.File1.markedCount(), 4);
+    EXPECT_EQ(page.files().markedCount(), 4);
     look(walk, u"66-in-pieces"_s);
     walk.press(u"MoogMeret"_s, u"Command4"_s);
     walk.waitFor(u"FtpFrm"_s);

@@ -61,22 +61,24 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     ASSERT_TRUE(files.removeFile(pieces + u"\\02 1015GNB0002_03AABB_jpp_001_002.prk"_s).ok());
     pick(u"Command8"_s, pieces + u"\\01 1015GNB0001_03AABB_jpp_001_001.prk"_s);
     auto& page = walk.page<SpltForm>(PageId::SpltForm);
-    ASSERT_EQ(page.List4Bodedim.count(), 6);
+    ASSERT_EQ(page.controls().List4Bodedim.count(), 6);
     const ControlFinder finder(walk.program().window());
-    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"List4Bodedim"_s, page.List4Bodedim.item(2)).ok());
-    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"ListChalakim"_s, page.ListChalakim.item(3)).ok());
+    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"List4Bodedim"_s, page.controls().List4Bodedim.item(2)).ok());
+    ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"ListChalakim"_s, page.controls().ListChalakim.item(3)).ok());
     walk.press(u"SpltForm"_s, u"Command6"_s);
-    EXPECT_EQ(page.List4Bodedim.currentIndex(), 2);
-    EXPECT_EQ(page.Label8.text, QString::number(*files.size(page.ListChalakim.item(3))));
+    EXPECT_EQ(page.controls().List4Bodedim.currentIndex(), 2);
+    EXPECT_EQ(page.controls().Label8.text, QString::number(*files.size(page.controls().ListChalakim.item(3))));
     look(walk, u"75-pieces-families"_s);
-    page.busy = true;
-    page.percent = 42;
-    page.Label4Work.text = u"3 / 6: 03 1015GNB0003_03AABB_jpp_001_003.prk"_s;
-    page.Command15.visible = true;
-    changed(page, walk);
-    look(walk, u"76-pieces-busy"_s);
-    page.busy = page.Command15.visible = false;
+    bool seen = false;
+    QObject::connect(&page, &Page::changed, [&] {
+        if (seen || page.phase() != SpltForm::Phase::Working || page.percent() < 40)
+            return;
+        seen = true;
+        look(walk, u"76-pieces-busy"_s);
+        EXPECT_TRUE(walk.pressable(u"SpltForm"_s, u"Command15"_s));
+    });
     walk.press(u"SpltForm"_s, u"Command1"_s);
+    EXPECT_TRUE(seen);
     look(walk, u"77-pieces-joined"_s);
     EXPECT_EQ(files.names(pieces + u"\\moorkavim"_s, u"*"_s).size(), 5);
     walk.press(u"SpltForm"_s, u"Image3"_s);

@@ -81,23 +81,17 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
 
     placePicture(walk);
     page.Timer2_Tick();
-    page.Timer2.stop();
     page.Timer4_Tick();
     look(walk, u"01-start-advert"_s);
-    page.Picture4Width = 120;
-    Q_EMIT page.moved();
+    while (page.motion().Picture4Width() > 120)
+        page.Timer2_Tick();
     look(walk, u"01-start-advert-closing"_s);
 
     walk.press(u"hatchala"_s, u"Image1"_s);
-    page.Timer3.stop();
-    page.Picture1Width = 115;
-    Q_EMIT page.moved();
-    walk.shot(u"01-start-shops-opening-%1"_s.arg(GetParam().english ? u"en"_s : u"he"_s));
-    page.Timer3.start();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.Timer3.running(); }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
     look(walk, u"01-start-shops"_s);
     walk.press(u"hatchala"_s, u"shopsBack"_s);
-    EXPECT_FALSE(page.Picture1.visible);
+    EXPECT_FALSE(page.controls().Picture1.visible);
     look(walk, u"01-start"_s);
 }
 
@@ -129,12 +123,12 @@ TEST(StartPage, HelpsAMouseAFingerAndTheKeyboard) {
             const QWidget& head = control(walk, u"Picture3"_s);
             EXPECT_EQ(head.isVisible(), !english);
             EXPECT_GE(head.height(), 32);
-            EXPECT_EQ(page.Picture2.visible, english);
-            EXPECT_EQ(page.Image2.visible, english);
+            EXPECT_EQ(page.controls().Picture2.visible, english);
+            EXPECT_EQ(page.controls().Image2.visible, english);
             mouseGoes(walk, name, false);
             EXPECT_EQ(shown(), QStringList());
-            EXPECT_TRUE(page.Picture2.visible && page.Image2.visible);
-            EXPECT_FALSE(page.Picture3.visible);
+            EXPECT_TRUE(page.controls().Picture2.visible && page.controls().Image2.visible);
+            EXPECT_FALSE(page.controls().Picture3.visible);
         }
     }
     // A finger that touches the lab's telephone, then the bare page.
@@ -160,9 +154,9 @@ TEST(StartPage, ItsMotionsPaintNothingButThemselves) {
     Paints words;
     control(walk, u"Label8"_s).installEventFilter(&arrow);
     control(walk, u"Title"_s).installEventFilter(&words);
-    const int top = page.Label8Top;
+    const int top = page.motion().Label8Top();
     walk.settle(400);
-    EXPECT_NE(page.Label8Top, top);
+    EXPECT_NE(page.motion().Label8Top(), top);
     EXPECT_GT(arrow.count, 3);
     EXPECT_EQ(words.count, 0);
     EXPECT_EQ(renderings, 0);
@@ -172,18 +166,18 @@ TEST(StartPage, ThePanelOfTheShopsUnfoldsAnswersAndCloses) {
     Walk walk({1024, 768}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
     hatchala& page = startPage(walk);
     walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.Timer3.running(); }, 5000));
-    EXPECT_EQ(page.Picture1Width, hatchala::panelWidth);
-    EXPECT_FALSE(page.Timer5.running());
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
+    EXPECT_EQ(page.motion().Picture1Width(), StartMotion::panelWidth);
+    EXPECT_FALSE(page.timers().Timer5.running());
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
     walk.settle();
     EXPECT_FALSE(control(walk, u"Picture1"_s).isVisible());
-    EXPECT_TRUE(page.Timer5.running());
+    EXPECT_TRUE(page.timers().Timer5.running());
 
     walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.Timer3.running(); }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
     const Result<void> chosen =
-        ControlFinder(walk.program().window()).choose(u"hatchala"_s, u"List1"_s, page.List1.item(1));
+        ControlFinder(walk.program().window()).choose(u"hatchala"_s, u"List1"_s, page.controls().List1.item(1));
     ASSERT_TRUE(chosen.ok()) << qPrintable(chosen.failure().message);
     walk.waitFor(u"nnn"_s);
     EXPECT_EQ(walk.program().state().KodMishloach, u"OSK");

@@ -27,27 +27,20 @@ private:
     QWidget* makeWays();
     QWidget* makeWalk();
     void makeBars();
-    void bindTheRest();
     void renderFiles();
     void renderWalk();
-    QString orderRow(const QString& folderName) const;
 
     MoogMeret& m_page;
-    QWidget* m_ordersCard = nullptr;
+    const MoogMeretControls& c;
     QListWidget* m_orders = nullptr;
     QWidget* m_hint = nullptr;
-    QFrame* m_files = nullptr;
     QListWidget* m_fileList = nullptr;
     QLabel* m_counts = nullptr;
     QWidget* m_ways = nullptr;
-    QLabel* m_pickFirst = nullptr;
     ScrolledPicture* m_preview = nullptr;
     QWidget* m_walk = nullptr;
     Gauge* m_gauge = nullptr;
     Gauge* m_end = nullptr;
-    QLabel* m_inHand = nullptr;
-    QLabel* m_nameInHand = nullptr;
-    QLabel* m_time = nullptr;
     QLabel* m_parts = nullptr;
     QPushButton* m_minutes = nullptr;
     QFrame* m_answer = nullptr;

@@ -24,31 +24,20 @@ private:
     QWidget* makeResult();
     void makeBars();
     // A list with its title over it. clicked null: only to look at.
-    QVBoxLayout* makeList(const QString& name, const TextList& list, const QString& hebrew, const QString& english,
-                          void (SpltForm::*clicked)(int) = nullptr);
-    QPushButton* workButton(const QString& name, const Caption& caption, void (SpltForm::*clicked)());
+    QVBoxLayout* makeList(const TextList& list, const Caption& caption, void (SpltForm::*clicked)(int) = nullptr);
+    QPushButton* workButton(const Caption& caption, void (SpltForm::*clicked)());
     void renderFamilies();
     void renderResult();
 
-    QLabel* m_cutHead = nullptr;
-    QLabel* m_joinHead = nullptr;
-    QLabel* m_counts = nullptr;
+    const SpltFormControls& c;
     QPushButton* m_cutFolder = nullptr;
     QListWidget* m_families = nullptr;
     QStringList m_familyWords; // as they stand in the rows
-    QLabel* m_length = nullptr;
     QFrame* m_result = nullptr;
     QLabel* m_resultSign = nullptr;
-    QLabel* m_resultLine = nullptr;
     QLabel* m_resultWhere = nullptr;
     QProgressBar* m_progress = nullptr;
-    struct Title {
-        QLabel* label;
-        QListWidget* list;
-        QString hebrew;
-        QString english;
-    };
-    std::vector<Title> m_titles;
+    std::vector<std::pair<const Caption*, QListWidget*>> m_titles;
 };
 
 } // namespace lumora

@@ -1,6 +1,6 @@
 #include "views/hatchala/StartDecoration.h"
 
-#include "start/hatchala.h"
+#include "start/StartMotion.h"
 #include "views/kit/Cards.h"
 
 #include <QPainter>
@@ -89,7 +89,7 @@ void ArrowStrip::paintEvent(QPaintEvent*) {
 AdvertisingPicture::AdvertisingPicture(const Theme& theme, QWidget* parent)
     : QWidget(parent)
     , m_theme(theme) {
-    setFixedSize(theme.px(hatchala::pictureWidth), theme.px(112));
+    setFixedSize(theme.px(StartMotion::pictureWidth), theme.px(112));
 }
 
 void AdvertisingPicture::setPicture(const QImage& picture) {

@@ -26,6 +26,7 @@ void keepPlaceWhenHidden(QWidget& widget) {
 
 hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files)
     : ViewOf(page, state, theme)
+    , c(page.controls())
     , m_files(files) {
     frame().steps().setStep(OrderStep::Start);
     frame().setTitleVisible(false);
@@ -42,13 +43,7 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     for (const char* name : {"Image1", "Image11", "Image5", "Image3"})
         findChild<QWidget*>(QString::fromLatin1(name))->setProperty("sinks", true);
     connect(&page, &hatchala::moved, this, &hatchalaView::renderMotion);
-    bind(u"Label8"_s, m_arrow, [&page] { return page.Label8.text; });
-    bindHidden(u"Label4Tel2"_s, page.Label4Tel2);
-    bindHidden(u"Label4Zel"_s, page.Label4Zel);
-    bindHidden(u"Picture8"_s, page.Picture8);
-    bindHidden(u"Label5"_s, page.Label5);
-    bindList(u"List2"_s, page.List2);
-    bindList(u"List4pices"_s, page.List4pices);
+    bind(u"Label8"_s, m_arrow, [this] { return c.Label8.text; });
     start();
 }
 
@@ -59,8 +54,8 @@ void hatchalaView::makeHeader() {
     setIcon(english, u"globe"_s, Theme::Colour::Ink);
     english->setCheckable(true);
     connect(english, &QPushButton::clicked, this, toPage(&hatchala::Check1_Click));
-    bind(u"Check1"_s, english, m_page.Check1);
-    QPushButton* leave = button(u"Image3"_s, m_page.Image3, Role::Quiet, &hatchala::Image3_MouseDown, u"exit"_s);
+    bind(english, c.Check1);
+    QPushButton* leave = button(c.Image3, Role::Quiet, &hatchala::Image3_MouseDown, u"exit"_s);
     helpFor(leave, hatchala::Hover::Image3);
     frame().addHeaderActions({english, leave});
 }
@@ -68,29 +63,27 @@ void hatchalaView::makeHeader() {
 QLayout* hatchalaView::makeWords() {
     const Card notice = makeCard("success", Pad::Normal);
     m_noticeBox = notice.frame;
-    notice.column->addWidget(label(u"Notice"_s, m_page.Notice, "strong"));
-    m_headline = label(u"Title"_s, m_page.Title, "display");
-    m_how = words("muted");
-    QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline, m_how});
-    for (const QString& icon : {u"pictures"_s, u"printer"_s, u"send"_s}) {
-        m_steps.push_back(words("body"));
-        column->addLayout(inRow(Space::Normal, {sign(icon, IconSize::Line), {m_steps.back(), 1}}));
-    }
-    QPushButton* prices = button(u"Image11"_s, m_page.Image11, Role::Plain, &hatchala::Image11_Click, u"tag"_s);
-    QPushButton* site = button(u"Image5"_s, m_page.Image5, Role::Plain, &hatchala::Image5_Click, u"globe"_s);
+    notice.column->addWidget(label(c.Notice, "strong"));
+    m_headline = label(c.Title, "display");
+    QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline, label(c.Label4How, "muted")});
+    const QString icons[] = {u"pictures"_s, u"printer"_s, u"send"_s};
+    for (std::size_t i = 0; i < c.Label4Step.size(); ++i)
+        column->addLayout(inRow(Space::Normal, {sign(icons[i], IconSize::Line), {label(c.Label4Step[i]), 1}}));
+    QPushButton* prices = button(c.Image11, Role::Plain, &hatchala::Image11_Click, u"tag"_s);
+    QPushButton* site = button(c.Image5, Role::Plain, &hatchala::Image5_Click, u"globe"_s);
     helpFor(prices, hatchala::Hover::Image11);
     helpFor(site, hatchala::Hover::Image5);
-    m_hints.push_back(makeHint(u"Label3"_s, m_page.Label3, {}));
+    m_hints.push_back(makeHint(c.Label3, {}));
     add(*column, {Item::room(), inRow(Space::Normal, {prices, site, m_hints.back().box, Item::room()})});
     return column;
 }
 
 QLayout* hatchalaView::makeSide() {
     // Right below the button that it speaks of.
-    m_hints.push_back(makeHint(u"Label4"_s, m_page.Label4, u"exit"_s));
+    m_hints.push_back(makeHint(c.Label4, u"exit"_s));
     QWidget* stage = makeStage();
     m_advert = new AdvertisingPicture(theme(), this);
-    bind(u"Picture4"_s, m_advert, [this] { return m_page.Picture4; });
+    bind(u"Picture4"_s, m_advert, [this] { return c.Picture4; });
     return inColumn(Space::Small, {{m_hints.back().box, 0, Qt::AlignTrailing},
                                    {stage, 1},
                                    {m_advert, 0, Qt::AlignCenter},
@@ -100,7 +93,7 @@ QLayout* hatchalaView::makeSide() {
 // The prints, and in their place what the control in hand does.
 QWidget* hatchalaView::makeStage() {
     m_prints = new Prints(this);
-    QLabel* head = label(u"Picture3"_s, m_page.Picture3, "muted");
+    QLabel* head = label(c.Picture3, "muted");
     head->setMinimumHeight(theme().size(IconSize::Line));
     head->setAlignment(Qt::AlignCenter);
     keepPlaceWhenHidden(*head);
@@ -114,8 +107,6 @@ QWidget* hatchalaView::makeStage() {
     place->addWidget(m_prints, 0, 0);
     place->addWidget(help, 0, 0);
     // Their place in the state is the one of the prints at the back and of the one in front.
-    bindHidden(u"Picture2"_s, m_page.Picture2);
-    bindHidden(u"Image2"_s, m_page.Image2);
     return inBox(place);
 }
 
@@ -124,18 +115,18 @@ QWidget* hatchalaView::makeHelp(hatchala::Hover over, const QString& icon) {
     m_helps.push_back({over, words("large")});
     card.column->addLayout(inRow(Space::Wide, {sign(icon, IconSize::Box), {m_helps.back().text, 1}}));
     const auto at = static_cast<std::size_t>(over);
-    bind(numbered("Image12", at), card.frame, m_page.Image12[at]);
+    bind(card.frame, c.Image12[at]);
     return card.frame;
 }
 
-hatchalaView::Hint hatchalaView::makeHint(const QString& name, const Caption& caption, const QString& icon) {
+hatchalaView::Hint hatchalaView::makeHint(const Caption& caption, const QString& icon) {
     QLabel* text = oneLine("smallMuted");
     QHBoxLayout* row = inRow(Space::Small);
     if (!icon.isEmpty())
         row->addWidget(sign(icon, IconSize::Small, Theme::Colour::Muted));
     row->addWidget(text);
     QWidget* box = inBox(row);
-    bind(name, box, caption);
+    bind(box, caption);
     return {&caption, box, text};
 }
 
@@ -144,10 +135,10 @@ QWidget* hatchalaView::makeContact() {
         text->setWordWrap(false);
         return inBox(inRow(Space::Small, {sign(icon, IconSize::Button), text}));
     };
-    m_telephone = entry(u"phone"_s, label(u"Label4Tel"_s, m_page.Label4Tel, "strong"));
-    m_mail = entry(u"mail"_s, label(u"Label1"_s, m_page.Label1, "body"));
+    m_telephone = entry(u"phone"_s, label(c.Label4Tel, "strong"));
+    m_mail = entry(u"mail"_s, label(c.Label1, "body"));
     QWidget* contact = inBox(inRow(Space::Wide, {m_telephone, m_mail}));
-    bind(u"Image6"_s, contact, m_page.Image6);
+    bind(contact, c.Image6);
     helpFor(contact, hatchala::Hover::Image6);
     return contact;
 }
@@ -158,29 +149,29 @@ void hatchalaView::makeStart() {
             m_page.Image1_Click();
     });
     connect(m_start, &QPushButton::pressed, this, toPage(&hatchala::Image1_MouseDown));
-    bind(u"Image1"_s, m_start, m_page.Image1);
+    bind(m_start, c.Image1);
     frame().addMainAction(m_start);
-    frame().addSecondaryAction(button(u"Image8"_s, m_page.Image8, Role::Quiet, &hatchala::Image8_Click, u"globe"_s));
-    frame().addStatus({label(u"Label7"_s, m_page.Label7, "muted"), label(u"Label6"_s, m_page.Label6, "large")});
+    frame().addSecondaryAction(button(c.Image8, Role::Quiet, &hatchala::Image8_Click, u"globe"_s));
+    frame().addStatus({label(c.Label7, "muted"), label(c.Label6, "large")});
     helpFor(m_start, hatchala::Hover::Image1);
 }
 
 // The question at which shop the prints are fetched.
 void hatchalaView::makeShops() {
     m_shops = new Overlay(theme(), this);
-    m_ask = words("title");
     auto* list = new QListWidget(m_shops);
     list->setFixedHeight(theme().px(130));
     const auto taken = [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); };
     connect(list, &QListWidget::itemClicked, this, taken);
     connect(list, &QListWidget::itemActivated, this, taken);
-    bindList(u"List1"_s, m_page.List1, list);
-    m_shopsBack = plainButton(u"shopsBack"_s, "secondary", toPage(&hatchala::Picture1_Escape));
-    add(*m_shops->column(), {m_ask, list, {m_shopsBack, 0, Qt::AlignLeading}});
+    bindList(list, c.List1);
+    add(*m_shops->column(), {label(c.List1Caption, "title"),
+                             list,
+                             {button(c.shopsBack, Role::Secondary, &hatchala::Picture1_Escape), 0, Qt::AlignLeading}});
     m_shops->setFirstFocus(list);
     m_shops->whenEscaped(toPage(&hatchala::Picture1_Escape));
     m_shopList = list;
-    bind(u"Picture1"_s, m_shops->card(), [this] { return m_page.Picture1.text; });
+    bind(u"Picture1"_s, m_shops->card(), [this] { return c.Picture1.text; });
 }
 
 void hatchalaView::helpFor(QWidget* widget, hatchala::Hover over) {
@@ -231,16 +222,17 @@ QWidget* hatchalaView::firstFocus() const {
 void hatchalaView::renderMotion() {
     if (isDetached())
         return;
+    const StartMotion& motion = m_page.motion();
     // Every second step is as much as an eye follows.
-    const int step = (m_page.Label8Top - hatchala::arrowTop) / 2 * 2;
-    m_arrow->setPhase(static_cast<double>(step) / (hatchala::arrowBottom - hatchala::arrowTop));
-    m_advert->setOpening(static_cast<double>(m_page.Picture4Width) / hatchala::pictureWidth);
-    m_shops->setReveal(static_cast<double>(m_page.Picture1Width) / hatchala::panelWidth);
+    const int step = (motion.Label8Top() - StartMotion::arrowTop) / 2 * 2;
+    m_arrow->setPhase(static_cast<double>(step) / (StartMotion::arrowBottom - StartMotion::arrowTop));
+    m_advert->setOpening(static_cast<double>(motion.Picture4Width()) / StartMotion::pictureWidth);
+    m_shops->setReveal(static_cast<double>(motion.Picture1Width()) / StartMotion::panelWidth);
 }
 
 void hatchalaView::renderAdvert() {
-    if (m_advertFile != m_page.Picture4) {
-        m_advertFile = m_page.Picture4;
+    if (m_advertFile != c.Picture4) {
+        m_advertFile = c.Picture4;
         QImage picture;
         if (const auto path = m_files.drives().toHost(m_advertFile)) {
             if (const auto loaded = loadPicture(*path))
@@ -252,14 +244,11 @@ void hatchalaView::renderAdvert() {
 }
 
 void hatchalaView::renderHelp() {
-    bool shown = false;
-    for (const Help& help : m_helps) {
-        const Caption& caption = m_page.Image12[static_cast<std::size_t>(help.over)];
-        help.text->setText(caption.text);
-        shown = shown || caption.visible;
-    }
+    for (const Help& help : m_helps)
+        help.text->setText(c.Image12[static_cast<std::size_t>(help.over)].text);
+    const bool shown = m_page.hover() != hatchala::Hover::Nothing;
     // In English the page leaves the prints where they are; the help needs their place all the same.
-    m_prints->show(m_page.Picture2.visible && !shown, m_page.Image2.visible && !shown);
+    m_prints->show(c.Picture2.visible && !shown, c.Image2.visible && !shown);
     for (const Hint& hint : m_hints)
         hint.text->setText(hint.caption->text.trimmed());
 }
@@ -267,28 +256,17 @@ void hatchalaView::renderHelp() {
 void hatchalaView::render() {
     setDirectedIcon(m_start, Way::Forwards);
     m_start->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight); // the arrow behind the word
-    m_how->setText(wording(u"הדפסת תמונות בשלושה צעדים פשוטים:"_s, u"Printing pictures takes three simple steps:"_s));
-    m_steps[0]->setText(wording(u"בוחרים תמונות מהמחשב, מכרטיס הזיכרון או מהמצלמה"_s,
-                                u"Choose pictures from the computer, a memory card or a camera"_s));
-    m_steps[1]->setText(wording(u"בוחרים גודל, סוג נייר וכמות"_s, u"Choose the size, the paper and how many"_s));
-    m_steps[2]->setText(wording(u"התוכנה שולחת את ההזמנה למעבדה"_s, u"The program sends the order to the lab"_s));
-    m_noticeBox->setVisible(m_page.Notice.visible && !m_page.Notice.text.isEmpty());
-    m_telephone->setVisible(!m_page.Label4Tel.text.isEmpty());
-    m_mail->setVisible(!m_page.Label1.text.isEmpty());
-    m_arrow->setVisible(m_page.Label8.visible);
+    m_noticeBox->setVisible(c.Notice.visible);
+    m_telephone->setVisible(!c.Label4Tel.text.isEmpty());
+    m_mail->setVisible(!c.Label1.text.isEmpty());
+    m_arrow->setVisible(c.Label8.visible);
     renderAdvert();
     renderHelp();
-    QStringList question = m_page.List1Caption.text.split(u'\n');
-    for (QString& line : question)
-        line = line.trimmed();
-    m_ask->setText(question.join(u'\n'));
-    const QString spoken = m_page.List1Caption.text.simplified();
+    const QString spoken = c.List1Caption.text.simplified();
     speak(m_shops, spoken);
     speak(m_shopList, spoken);
-    m_shopsBack->setText(wording(u"חזרה"_s, u"Back"_s));
-    m_shopsBack->setAccessibleName(m_shopsBack->text());
     renderMotion();
-    m_shops->setOpen(m_page.Picture1.visible);
+    m_shops->setOpen(c.Picture1.visible);
 }
 
 } // namespace lumora

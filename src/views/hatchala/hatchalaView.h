@@ -36,12 +36,10 @@ private:
     void renderAdvert();
     void renderHelp();
 
+    const hatchalaControls& c;
     const Files& m_files;
     QPushButton* m_start = nullptr;
     QLabel* m_headline = nullptr;
-    QLabel* m_how = nullptr;
-    std::vector<QLabel*> m_steps;
-    QLabel* m_ask = nullptr;
     QFrame* m_noticeBox = nullptr;
     QWidget* m_telephone = nullptr;
     QWidget* m_mail = nullptr;
@@ -56,7 +54,7 @@ private:
         QLabel* text;
     };
     std::vector<Hint> m_hints;
-    Hint makeHint(const QString& name, const Caption& caption, const QString& icon);
+    Hint makeHint(const Caption& caption, const QString& icon);
     struct Help {
         hatchala::Hover over;
         QLabel* text;
@@ -64,7 +62,6 @@ private:
     std::vector<Help> m_helps;
     Overlay* m_shops = nullptr;
     QWidget* m_shopList = nullptr;
-    QPushButton* m_shopsBack = nullptr;
     std::vector<std::pair<QWidget*, hatchala::Hover>> m_hovers;
 };
 
