@@ -29,7 +29,7 @@ namespace lumora {
 
 // In the order in which each stands on those before it.
 struct Program::Parts {
-    Parts(Deployment read, const HostPath& dataFolder)
+    Parts(Deployment read, const HostPath& dataFolder, Internet* line)
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
@@ -39,7 +39,7 @@ struct Program::Parts {
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files)
-        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances} {
+        , platform{files, dialogs, line ? *line : internet, mail, shell, clock, pump, volume, instances} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
     }
 
@@ -94,7 +94,7 @@ Result<void> Program::start() {
     if (made)
         std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
 
-    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder);
+    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, m_options.internet);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     registerViews(parts.window, parts.chain, parts.state, parts.files);

@@ -10,6 +10,7 @@
 
 namespace lumora {
 
+class Internet;
 class MainWindow;
 class PageChain;
 class ScreenDialogs;
@@ -21,6 +22,7 @@ struct ProgramOptions {
     std::optional<HostPath> dataFolder; // what stands behind the program's own drive letter
     QSize windowSize;                   // an empty one leaves the size to the screen
     bool fullScreen = false;
+    Internet* internet = nullptr; // in place of the machine's own line
 };
 
 // One run of the program: the session, the machine, the chain of pages and the window. Needs an Application (in

@@ -68,8 +68,9 @@ public:
     UploadForm& page() { return static_cast<UploadForm&>(*chain.find(PageId::UploadForm)); }
     // The panel grows, the count runs out and the order is sent.
     void countDown() {
-        while (page().Timer1.running())
+        while (page().counting() && page().controls().Picture1Width < UploadFormControls::Picture1FullWidth)
             page().Timer1_Tick();
+        page().Timer1_Tick();
         for (int tick = 0; tick < 6; ++tick)
             page().Timer2_Tick();
     }

@@ -1,4 +1,5 @@
 #include "support/FakeWebLab.h"
+#include "support/RecordedSending.h"
 #include "support/UploadFormRig.h"
 
 #include <gtest/gtest.h>
@@ -21,11 +22,11 @@ struct UploadFormTest : ::testing::Test {
 TEST_F(UploadFormTest, SendsEachFileOnceAndReportsOnce) {
     UploadForm& page = rig.send();
     EXPECT_TRUE(arrived());
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
     EXPECT_EQ(lab.posted.size(), 5);
-    EXPECT_EQ(page.Label16.text, UploadFormRig::name());
-    EXPECT_TRUE(page.Picture6.visible);
-    EXPECT_EQ(page.percent, 100);
+    EXPECT_EQ(page.controls().Label16.text, UploadFormRig::name());
+    EXPECT_TRUE(page.controls().Picture6.visible);
+    EXPECT_EQ(page.controls().percent, 100);
     ASSERT_EQ(lab.reports.size(), 2);
     EXPECT_TRUE(lab.reports[0].startsWith(u"http://192.0.2.10/aaaqamootreport/padd.asp?k1=tarvelmond&t1="_s +
                                           UploadFormRig::name()));
@@ -39,16 +40,16 @@ TEST_F(UploadFormTest, AResendIsNotReportedAndAnOrderThatIsThereIsNotSent) {
     EXPECT_TRUE(arrived());
     EXPECT_EQ(lab.reports, QStringList());
     rig.page().Command2_Click();
-    EXPECT_TRUE(rig.page().done);
-    EXPECT_TRUE(rig.page().Label11.visible);
-    EXPECT_FALSE(rig.page().Timer1.running());
+    EXPECT_TRUE(hasArrived(rig.page().phase()));
+    EXPECT_TRUE(rig.page().controls().Label11.visible);
+    EXPECT_FALSE(rig.page().counting());
     EXPECT_EQ(lab.posted.size(), 5);
 }
 
 TEST_F(UploadFormTest, OnlyWhatTheListLacksGoesAgain) {
     lab.losses = {{UploadFormRig::second(), 1}, {UploadFormRig::log(), 2}};
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
     EXPECT_TRUE(arrived());
     EXPECT_EQ(lab.posted.size(), 5 + 2 + 1);
     EXPECT_EQ(lab.urls.filter(u"filelisthom2.txt"_s).size(), 1) << "two were missing";
@@ -113,17 +114,16 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         UploadFormRig other(faulty);
         c.set(faulty);
         UploadForm& page = other.send();
-        EXPECT_EQ(page.done, c.done);
-        EXPECT_EQ(page.failed, !c.done);
-        EXPECT_EQ(page.Image5.visible, !c.done);
-        EXPECT_EQ(page.Label1.text, c.done ? QString() : threeAttempts);
+        EXPECT_EQ(page.phase(), c.done ? SendingPhase::Success : SendingPhase::NotAll);
+        EXPECT_EQ(page.controls().Image5.visible, !c.done);
+        EXPECT_EQ(page.controls().Label1.text, c.done ? QString() : threeAttempts);
         EXPECT_EQ(faulty.reports.isEmpty(), !c.done);
         EXPECT_EQ(other.localFiles().size(), 5u);
         EXPECT_EQ(faulty.posted.size(), c.posted);
         if (c.done)
             continue;
-        EXPECT_TRUE(page.Label4Reason.visible);
-        EXPECT_EQ(page.Label4Reason.text,
+        EXPECT_TRUE(page.controls().Label4Reason.visible);
+        EXPECT_EQ(page.controls().Label4Reason.text,
                   LineTroubleText(other.state, c.reason, {}, other.localFiles().rbegin()->first));
     }
 }
@@ -135,7 +135,7 @@ TEST_F(UploadFormTest, AServerThatIsBackAtTheThirdAttemptTakesAnOrderOfThreeFile
     lab.deadCalls = 9;
     lab.deadPosts = 6;
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
     EXPECT_TRUE(arrived());
     EXPECT_EQ(lab.posted.size(), 9);
     EXPECT_EQ(lab.urls.filter(u"filelisthom3.txt"_s).size(), 2);
@@ -148,12 +148,11 @@ TEST_F(UploadFormTest, AReportThatNobodyTakesIsNotRepeatedAndChangesNothing) {
             lab.deadReports = 1;
     };
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.done);
-    EXPECT_FALSE(page.failed);
+    EXPECT_TRUE(hasArrived(page.phase()));
     ASSERT_EQ(lab.reports.size(), 2) << "the done call is made all the same";
     EXPECT_TRUE(lab.reports[1].contains(u"/p.asp?"_s));
     page.Command2_Click();
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
     EXPECT_EQ(lab.reports.size(), 2) << "an order that is there is not reported again";
 }
 
@@ -176,45 +175,22 @@ TEST_F(UploadFormTest, AFileThatNeverCameToTheLineIsNotLaidToTheServer) {
     const QString quoted = u"311015GNB0003_03\".jpp"_s; // its header would end at the quote
     rig.write(quoted, "x");
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.failed);
-    EXPECT_EQ(page.Label12.text, u"1"_s);
-    EXPECT_EQ(page.Label4Reason.text, LineTroubleText(rig.state, LineStep::File, {}, quoted));
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_EQ(page.controls().Label12.text, u"1"_s);
+    EXPECT_EQ(page.controls().Label4Reason.text, LineTroubleText(rig.state, LineStep::File, {}, quoted));
     EXPECT_EQ(lab.posted.size(), 5);
-}
-
-TEST_F(UploadFormTest, ARestOfAnAttemptCanBeStoppedAndContinuedToo) {
-    lab.deadPosts = FakeLab::always;
-    UploadForm& page = rig.send();
-    ASSERT_TRUE(page.failed);
-    EXPECT_TRUE(page.Command3.visible && page.Image5.visible);
-    page.Command3_Click();
-    EXPECT_TRUE(page.Command10.visible);
-    EXPECT_FALSE(page.failed || page.Image5.visible || page.Command3.visible);
-    lab.deadPosts = 0;
-    page.Command10_Click();
-    rig.countDown();
-    EXPECT_TRUE(page.done);
-    EXPECT_TRUE(arrived());
-}
-
-TEST_F(UploadFormTest, AListWithoutATotalMarksWhatItNames) {
-    UploadForm& page = rig.send();
-    lab.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp~~!105_1234.jpg";
-    page.Command7_Click();
-    EXPECT_EQ(page.TxtWeb.text, u"0"_s);
-    EXPECT_EQ(page.List4Hossarim.count(), 3);
 }
 
 TEST_F(UploadFormTest, StopHoldsTheCountAndContinueTakesItUp) {
     UploadForm& page = rig.start();
-    EXPECT_TRUE(page.Timer1.running());
+    EXPECT_TRUE(page.counting());
     page.Command3_Click();
-    EXPECT_FALSE(page.Timer1.running() || page.Timer2.running() || page.Picture1.visible || page.Command3.visible);
-    EXPECT_TRUE(page.Command10.visible);
+    EXPECT_FALSE(page.counting() || page.controls().Picture1.visible || page.controls().Command3.visible);
+    EXPECT_TRUE(page.controls().Command10.visible);
     page.Timer2_Tick();
     EXPECT_TRUE(lab.posted.isEmpty());
     page.Command10_Click();
-    EXPECT_FALSE(page.Command10.visible);
+    EXPECT_FALSE(page.controls().Command10.visible);
     rig.countDown();
     EXPECT_TRUE(arrived());
 }
@@ -224,20 +200,20 @@ TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
               UploadFormRig::name().toLatin1() + "~~!105_1234.jpg~~" + UploadFormRig::first().toLatin1() + "~~total:2");
     lab.refusesLists = true;
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.failed);
-    EXPECT_EQ(page.List4Kvazim.count(), 5);
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_EQ(page.lists().List4Kvazim.count(), 5);
     EXPECT_FALSE(lab.posted.contains(UploadFormRig::list()));
     EXPECT_FALSE(rig.test.files.fileExists(UploadFormRig::folder() + u'\\' + UploadFormRig::list()));
 }
 
 TEST_F(UploadFormTest, SaysWhenThereIsNothingToSendOrNobodyToSendTo) {
     rig.state.profile.HttpHost.clear();
-    EXPECT_TRUE(rig.start().failed);
-    EXPECT_FALSE(rig.page().Timer1.running());
+    EXPECT_EQ(rig.start().look().sign, SendingSign::Bad);
+    EXPECT_FALSE(rig.page().counting());
     FakeWebLab other;
     UploadFormRig empty(other);
     empty.state.transfer.OrderFolder = u"C:\\"_s;
-    EXPECT_TRUE(empty.start().failed);
+    EXPECT_EQ(empty.start().look().sign, SendingSign::Bad);
     EXPECT_TRUE(lab.urls.isEmpty() && other.urls.isEmpty());
 }
 
@@ -248,18 +224,23 @@ TEST_F(UploadFormTest, NothingMoreIsSentOnceThePageIsLeft) {
     EXPECT_TRUE(rig.chain.hasEnded());
 }
 
-TEST_F(UploadFormTest, CheckingTheServerNeedsTheFirstFileInTheOrdersFolder) {
-    UploadForm& page = rig.send();
-    ASSERT_TRUE(page.done);
-    page.Command7_Click();
-    EXPECT_EQ(page.TxtWeb.text, u"1"_s);
-    page.List4Kvazim.clear();
-    page.List4Kvazim.append(QStringList{u"C:\\elsewhere\\a.jpp"_s});
-    page.Command7_Click();
-    EXPECT_EQ(page.TxtWeb.text, u"-1"_s);
-    page.List4Kvazim.clear();
-    page.Command7_Click();
-    EXPECT_EQ(page.TxtWeb.text, u"-1"_s);
+TEST(HttpSender, BelievesAListOnlyOfTheOrdersFolderAndWithATotal) {
+    FakeWebLab lab;
+    UploadFormRig rig{lab};
+    RecordedSending told;
+    HttpSender sender(rig.state, rig.test.platform, told);
+    sender.BuildOrderFileList();
+    sender.lists.List4Hossarim.append(sender.lists.List4Kvazim.items());
+    EXPECT_EQ(sender.HttpAttempts(), SendingPhase::Success);
+    EXPECT_EQ(told.names.size(), 5);
+    EXPECT_EQ(sender.CheckOrderOnServer(0), ServerVerdict::Listed);
+    lab.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp~~!105_1234.jpg";
+    EXPECT_EQ(sender.CheckOrderOnServer(0), ServerVerdict::NotVerified);
+    EXPECT_EQ(told.number(SendingMoment::Missing), 3) << "what is named counts all the same";
+    sender.lists.List4Kvazim.clear();
+    EXPECT_EQ(sender.CheckOrderOnServer(0), ServerVerdict::OtherFolder);
+    sender.lists.List4Kvazim.append(u"C:\\elsewhere\\a.jpp"_s);
+    EXPECT_EQ(sender.CheckOrderOnServer(0), ServerVerdict::OtherFolder);
 }
 
 } // namespace

@@ -7,7 +7,6 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "transfer/ftp/FtpFrm.h"
 #include "views/window/ScreenDialogs.h"
 
 #include <QPainter>
@@ -100,15 +99,6 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     look(walk, u"66-in-pieces"_s);
     walk.press(u"MoogMeret"_s, u"Command4"_s);
     walk.waitFor(u"FtpFrm"_s);
-    walk.settle(200);
-    auto& sender = walk.page<FtpFrm>(PageId::FtpFrm);
-    sender.Timer1.stop();
-    sender.sending = true;
-    sender.percent = 60;
-    sender.PicInProgKatanWidth = FtpBoard::Pic4ProgWidth * 2 / 3;
-    sender.Label4Diff.text = u"4"_s;
-    changed(sender, walk);
-    look(walk, u"67-sending-pieces"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, FinishedOrdersLook, PageLook::screens(), PageLook::nameOf);

@@ -5,7 +5,6 @@
 #include "order/EditRecord.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "transfer/ftp/FtpFrm.h"
 #include "views/kit/Overlay.h"
 #include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
@@ -86,47 +85,6 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
     walk.waitFor(u"FtpFrm"_s);
     walk.settle(200);
     look(walk, u"17-countdown"_s);
-
-    auto& page = walk.page<FtpFrm>(PageId::FtpFrm);
-    page.Timer1.stop();
-    page.sending = true;
-    page.percent = 42;
-    page.Label3.text = walk.program().state().wording(u"  כעת מעלה לשרת "_s, u"  Now uploading "_s);
-    page.Label4File.text =
-        walk.program().state().wording(u"קובץ 3 מתוך 6: IMG_0003.jpg"_s, u"File 3 of 6: IMG_0003.jpg"_s);
-    page.Label34.text = walk.program().state().wording(u"נסיון שני לקבצים שלא עלו"_s,
-                                                       u"Second attempt for the files that did not go up"_s);
-    page.Command15.enabled = true;
-    changed(page, walk);
-    look(walk, u"18-sending"_s);
-    page.sending = false;
-    page.Label34.text.clear();
-    page.Label4File.text.clear();
-    page.Picture6.visible = page.Label2.visible = page.Label9.visible = page.Command10.visible =
-        page.Command28.visible = true;
-    page.Label4Missing.text = u"3"_s;
-    page.Label12.text = u"6"_s;
-    page.Label2.text = walk.program().state().wording(u"השרת לא ענה"_s, u"The server did not answer"_s);
-    page.Label3.text = walk.program().state().wording(u"לא כל הקבצים הועלו"_s, u"Not all the files were uploaded"_s);
-    changed(page, walk);
-    look(walk, u"19-failed"_s);
-    page.Picture7.visible = true;
-    changed(page, walk);
-    look(walk, u"20-leave-sending"_s);
-    page.Picture7.visible = page.Picture6.visible = page.Label2.visible = page.Label9.visible = page.Command10.visible =
-        false;
-    page.AllDone = 1;
-    page.Picture2.visible = true;
-    page.Image4.visible = page.Image5.visible = false;
-    page.Command11.enabled = true;
-    page.Label3.text =
-        walk.program().state().wording(u"הקבצים הועלו בהצלחה"_s, u"The files were uploaded successfully"_s);
-    changed(page, walk);
-    look(walk, u"21-sent"_s);
-    page.AllDone = 0;
-    page.Frame2.visible = true;
-    changed(page, walk);
-    look(walk, u"22-for-the-lab"_s);
 }
 
 TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {

@@ -129,7 +129,7 @@ QString clippedText(const QWidget& widget) {
 
 } // namespace
 
-Walk::Walk(QSize size, const QString& labSettings) {
+Walk::Walk(QSize size, const QString& labSettings, Internet* line) {
     const HostPath root(m_folder.path().toStdString());
     std::filesystem::create_directories(root / "Pictures");
     QFile lab(m_folder.filePath(u"lab.ini"_s));
@@ -142,6 +142,7 @@ Walk::Walk(QSize size, const QString& labSettings) {
     options.labFile = toHostPath(lab.fileName());
     options.dataFolder = root / "drive_c";
     options.windowSize = size;
+    options.internet = line;
     m_program = std::make_unique<Program>(std::move(options));
     const Result<void> started = m_program->start();
     EXPECT_TRUE(started.ok()) << (started ? "" : qPrintable(started.failure().message));
@@ -149,8 +150,8 @@ Walk::Walk(QSize size, const QString& labSettings) {
     settle(60);
 }
 
-Walk::Walk(const Screen& screen, const QString& labSettings)
-    : Walk(screen.size, labSettings) {
+Walk::Walk(const Screen& screen, const QString& labSettings, Internet* line)
+    : Walk(screen.size, labSettings, line) {
     if (screen.english)
         press(u"hatchala"_s, u"Check1"_s);
 }

@@ -13,6 +13,8 @@
 
 namespace lumora {
 
+class Internet;
+
 struct Screen {
     QSize size;
     bool english;
@@ -22,9 +24,9 @@ struct Screen {
 // are visible, enabled and not covered. A step that fails is a failure of the test that takes it.
 class Walk {
 public:
-    explicit Walk(QSize size, const QString& labSettings = {});
+    explicit Walk(QSize size, const QString& labSettings = {}, Internet* line = nullptr);
     // In that language, turned to on the start page.
-    explicit Walk(const Screen& screen, const QString& labSettings = {});
+    explicit Walk(const Screen& screen, const QString& labSettings = {}, Internet* line = nullptr);
     ~Walk();
 
     Program& program() { return *m_program; }

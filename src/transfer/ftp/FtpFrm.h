@@ -1,68 +1,63 @@
 #pragma once
 
 #include "platform/files/Files.h"
-#include "session/Page.h"
 #include "session/Ticker.h"
-#include "transfer/ftp/FtpBoard.h"
-
-#include <memory>
+#include "transfer/ftp/FtpFrmControls.h"
+#include "transfer/ftp/FtpSender.h"
 
 namespace lumora {
 
-class PageChain;
-struct Platform;
-struct SessionState;
-struct UploadRoom;
-
-// The sending page: takes one finished order folder and gets all of its files onto the lab's server. It lists them,
-// counts down, sends each on a connection of its own, then looks at what arrived and goes round again for what did not,
-// four times in all. Success sends the two reports. A stop or a failure leaves the local folder as it is, so that the
-// order can be sent again.
-class FtpFrm : public Page, public FtpBoard {
+// FtpFrm, "sending an order by FTP" in the glossary: the customer waits here while one finished order folder goes to
+// the lab's server. The page lists its files, counts down, sends, and goes round again for what has not arrived, four
+// times in all. Success sends the two reports. A stop or a failure leaves the local folder as it is, so that the order
+// can be sent again.
+class FtpFrm : public SendingPage, private FtpFrmControls, private SendingEvents {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::FtpFrm;
+
     FtpFrm(SessionState& state, const Platform& platform, PageChain& chain);
-    ~FtpFrm() override;
 
     void load() override;
     void setTexts() override;
 
     // Events.
-    void Form_Activate();   // the page has come up: a new order or a resend begins by itself
-    void Timer1_Tick();     // one second of the countdown
-    void Timer2_Tick();     // blinks
-    void Command12_Click(); // send: up to four attempts
-    void Command10_Click(); // send again, all that is missing
-    void Image5_Click();    // send now, without waiting for the countdown
-    void Command23_Click(); // stop the countdown, go on with it
-    void Command18_Click(); // stop the countdown
-    void Command15_Click(); // stop the sending
-    void Command21_Click(); // stop the sending
-    void Image3_Click();    // close
-    void Command14_Click(); // do not close after all
-    void Command16_Click(); // close although nothing was sent
-    void Command11_Click(); // exit
-    void Command8_Click();  // exit
-    void Command28_Click(); // a new order
-    void Image4_Click();    // order number to the clipboard, folder on the screen
-    void Command24_Click(); // show the hidden area
-    void Command9_Click();  // hide it
-    void Command22_Click(); // "press here in case of a communication fault"
+    void Timer1_Tick() { countSecond(); }
+    void Timer2_Tick() { blink(); }
+    void Command12_Click() { sendOrder(); }
+    void Command10_Click() { sendAgain(); }
+    void Image5_Click() { sendNow(); }
+    void Command23_Click() { holdOrGoOn(); }
+    void Command18_Click() { holdCount(); }
+    void Command15_Click() { stopSending(); }
+    void Command21_Click() { stopSending(); }
+    void Image3_Click() { close(); }
+    void Command14_Click() { stay(); }
+    void Command16_Click() { leaveProgram(); }
+    void Command11_Click() { leaveProgram(); }
+    void Command8_Click() { leaveProgram(); }
+    void Command28_Click() { leaveForAnother(); }
+    void Image4_Click() { openOrderFolder(); }
+    void Command24_Click() { showLabArea(true); }
+    void Command9_Click() { showLabArea(false); }
+    void Command22_Click() { sendChainAfterFault(); }
 
-    // Events of the hidden area.
-    void Command13_Click(); // before sending: a new order
-    void Command1_Click();  // before sending: a resend
-    void Command2_Click();  // older bulk path: refill and send
-    void Command4_Click();  // older bulk path: up to three rounds
-    void Command17_Click(); // one order of the chain
-    void Command19_Click(); // all orders of the chain
-    void Command25_Click(); // BdikaAfterUploadB: what of the chosen order has arrived
-    void Command26_Click(); // shows the proof picture
-    void Command27_Click(); // copy
-    void Command3_Click();  // put
-    void Command5_Click();  // get
-    void Command6_Click();  // delete
-    void Command7_Click();  // make dir
+    // Events of the lab's own area.
+    void Command13_Click() { beginNewOrder(); }
+    void Command1_Click() { beginResend(); }
+    void Command2_Click() { refillAndSendInRounds(); }
+    void Command4_Click() { sendInRounds(); }
+    void Command17_Click() { sendChosenOrder(); }
+    void Command19_Click() { sendChain(); }
+    void Command25_Click() { checkChosenOrder(); } // BdikaAfterUploadB
+
+    // Events that no control sends; FtpFrmUnused.cpp.
+    void Command26_Click() { showProof(); }
+    void Command27_Click();
+    void Command3_Click();
+    void Command5_Click();
+    void Command6_Click();
+    void Command7_Click();
     void cmdInternetOpen_Click();
     void cmdClosehOpen_Click();
     void optBin_Click();
@@ -71,79 +66,104 @@ public:
     void File1_Click(int index);
     void List2_Click(int index);
     void ListRezefFiles_Click(int index);
+    void takeChain(const QStringList& folderNames); // into ListRezefFiles
+    // Makes a resend of a folder from File1 itself, as the finished-orders page does.
+    void PrepareResendHere(const QString& folder);
+    // Shows number, server's reply and a question whether to close.
+    void FtpFatalErrorAsk(const Failure& failure, const QString& source);
 
-    // State: see FtpBoard. The file list of the order folder and the timers stand here.
-    FileList File1;
-    Ticker Timer1;              // 1000 ms
-    Ticker Timer2;              // 500 ms
-    std::int16_t AllDone = 0;   // 1 after success; read by the close button
-    std::int16_t NumToSend = 0; // number of files that make up the order
+    // State.
+    const FtpFrmControls& controls() const override { return *this; }
+    const FtpLists& lists() const { return m_sender.lists; }
+    const FtpSender& sender() const { return m_sender; }
+    const FileList& files() const { return File1; }
+    bool counting() const { return Timer1.running(); }
 
     // The signal is Page::changed().
 
-    // Takes one chain order by its folder name and sends it.
-    void SendChainOrder(const QString& name);
-    // Makes a resend of a folder from File1 itself, as the finished-orders page does. No caller.
-    void PrepareResendHere(const QString& folder);
-    // The routine with the yes/no box that the makers meant for a fatal error. No caller.
-    void AskAfterFatalError();
-
 private:
-    enum class Phase {
-        Preparing, // the order's folder is being read: start controls would find nothing yet
-        NoOrder,
-        NoServer,
-        Countdown,
-        Waiting,
-        Sending,
-        Checking,
-        Reporting,
-        Success,
-        NotAll,
-        Stopped,
-        Silent,
-    };
-
     // FtpFrm.cpp
-    void activateWhenFree();
+    void begin() override;
+    void leave() override;
+    void countSecond();
+    void blink();
+    void holdOrGoOn();
+    void holdCount();
+    void startCount();
+    void stopTimers();
+    void showSeconds();
+    void showSecondsAfterFailure();
+    void sendOrder();
+    void sendAgain();
+    void sendNow();
+    void stopSending();
+    void close();
+    void stay();
+    void leaveForAnother();
+    void openOrderFolder();
+    void showLabArea(bool shown);
+    bool canSend() const;
+    bool inPieces() const;
+    void finish(SendingPhase end);
+    void succeed();
+    void showFailure();
+    void showProof();
+    void FtpEnableControls(bool enable);
+
+    // FtpFrmTexts.cpp
+    const PhaseLook& lookOf(SendingPhase phase) const override;
+    QString advice(const PhaseLook& row) const override;
+    void showPhase(const PhaseLook& row) override;
     void setButtonTexts();
     void setPanelTexts();
-    void showWhatToDo();
-    void enter(Phase phase);
-    void leaveProgram();
-    void leavePage();
-    QString silentEndText() const;
-    void stopTimers();
-    void addProofPicture();
+    void showMinutes();
+    void showCounts();
+    void showAttempt(int attempt);
+    void showStoppedBoxes();
+    void showNoServerBoxes();
+
+    // FtpFrmEvents.cpp
+    void reached(SendingMoment moment, int number) override;
+    void progressed(int index, int count) override;
+    void sending(int index, int count, const QString& name) override;
+    void pieceSent(double share, std::optional<int> minutes) override;
+    void failed(LineStep step, const Failure& failure, const QString& subject) override;
+    void brokenNotKept(const Failure& failure) override;
+    void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) override;
+    void pausing(int round) override;
+    void status(const QString& text);
+    void captionFollowsStatus();
+    void showIncomplete(int missing);
 
     // FtpFrmOrder.cpp
+    void beginNewOrder();
+    void beginResend();
     bool settingsFound();
-    void beginList();
+    void clearLists();
     void listFolder();
-    bool orderIsChosen() const;
-    void CountOrderPictures();
+    void addProofPicture();
+    void countPictures();
     void ShowOrderSummary();
     void armCountdown();
 
-    // FtpFrmAttempts.cpp
-    Phase RunAttempts();
-    bool checkAttempt(int attempt);
-    void showNotAll();
-    void showFailure();
-    void SendSuccess();
-    void finish(Phase phase);
+    // FtpFrmLabArea.cpp
+    void refillAndSendInRounds();
+    void sendInRounds();
+    void sendChosenOrder();
+    void sendChain();
+    void sendChainAfterFault();
+    void SendChainOrder(const QString& name);
+    void checkChosenOrder();
 
-    // FtpFrmHidden.cpp
+    // FtpFrmUnused.cpp
     bool inSession(const QString& message);
     QString chosenRemoteName();
 
-    SessionState& m_state;
-    const Platform& m_platform;
-    PageChain& m_chain;
-    std::unique_ptr<UploadRoom> m_room; // the rules at work
-    QStringList m_handedOver;           // the lines that the finished-orders page gave
-    Phase m_phase = Phase::Preparing;
-    bool m_activated = false;
+    FileList File1;
+    Ticker Timer1; // 1000 ms: the countdown
+    Ticker Timer2; // 500 ms: the blinking
+    FtpSender m_sender;
+    QStringList m_handedOver; // the lines that the finished-orders page gave
     // Asked for by Command26, set by no page.
     bool m_proofWanted = false;
     QString m_proofText;

@@ -1,98 +1,69 @@
-// What the sending page sends: the files of a new order or of a resend, in the order in which they travel.
+// What the page sends: the files of a new order or of a resend, in the order in which they travel.
 #include "common/DrivePathText.h"
 #include "editing/editor/gdisave.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
-#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
-#include "order/PieceName.h"
-#include "order/PrintCode.h"
-#include "platform/Dialogs.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
 #include "session/PageChain.h"
+#include "session/SessionState.h"
 #include "session/Workspace.h"
+#include "transfer/delivery/OrderFiles.h"
 #include "transfer/delivery/OrderSummary.h"
 #include "transfer/ftp/FtpFrm.h"
-#include "transfer/http/UploadRoom.h"
 
-#include <algorithm>
 #include <utility>
 
 namespace lumora {
 
 bool FtpFrm::settingsFound() {
-    if (CheckFtpSettings(m_state))
+    if (CheckFtpSettings(m_state.profile))
         return true;
     stopTimers();
-    enter(Phase::NoServer);
-    m_platform.dialogs.message(
-        m_state.wording(QStringLiteral("המחשב לא מצא שרת זמין\rנסה במועד מאוחר יותר"),
-                        QStringLiteral("The computer found no available server.\rTry at a later time.")));
-    m_platform.dialogs.message(m_state.wording(
-        QStringLiteral("אין צורך לבצע את הבחירה מהתחלה\rפשוט יש להפעיל את התוכנה מהתחלה\rולבחור מהאפשרויות "
-                       "\r  ש ל י ח ה    ח ו ז ר ת  "),
-        QStringLiteral(
-            "There is no need to choose again.\rJust start the program\rand pick from the options\r  R E S E N D  ")));
+    enter(SendingPhase::NoServer);
+    showNoServerBoxes();
     return false;
 }
 
-bool FtpFrm::orderIsChosen() const {
-    return OrderFolder::chosen(m_state).isChosen();
-}
-
-void FtpFrm::beginList() {
-    for (TextList* list : {&List3, &List4Makor, &List4Broken, &List6, &List7})
-        list->clear();
-    NumToSend = 0;
-    m_room->check.NumOnServer = 0;
-    m_state.transfer.ShemTikiya = OrderFolder::chosen(m_state).name();
-    if (orderIsChosen())
+void FtpFrm::clearLists() {
+    m_sender.clearLists();
+    m_state.transfer.ShemTikiya = LeafName(m_state.transfer.OrderFolder);
+    if (IsOrderFolder(m_state.transfer.OrderFolder))
         Label46.text = m_state.transfer.ShemTikiya;
 }
 
 void FtpFrm::listFolder() {
     const QString& folder = m_state.transfer.OrderFolder;
-    beginList();
+    clearLists();
     File1Index = -1;
-    if (!orderIsChosen()) {
+    if (!IsOrderFolder(folder)) {
         Label7.text = QStringLiteral("0");
         return;
     }
     File1.setFolder(folder);
     File1.refresh();
     Label7.text = QString::number(File1.count());
-    const QString log = OrderFolder(folder).logPath();
-    ReadOrderDetails(m_platform.files, log, m_state.shemot);
+    ReadOrderDetails(m_platform.files, OrderTextPath(folder), m_state.shemot);
     ShowOrderSummary();
-    // The order text always travels ahead of the pictures.
-    if (m_platform.files.fileExists(log))
-        List3.append(log);
-    if (m_state.transfer.Mefurak == Travel::Whole) {
-        for (const QString& name : File1.names())
-            List3.append(JoinDrivePath(folder, name));
-    } else {
-        const auto sheet = std::find_if(File1.names().begin(), File1.names().end(), IsSheet);
-        // Without a sheet the entry is the folder itself, and its put fails.
-        List3.append(JoinDrivePath(folder, sheet == File1.names().end() ? QString() : *sheet));
-        for (const QString& name : File1.names()) {
-            if (IsPiece(name))
-                List3.append(JoinDrivePath(folder, name));
-        }
-    }
+    m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, folder, File1.names(), inPieces()));
     addProofPicture();
 }
 
 void FtpFrm::addProofPicture() {
     const QString proof = WorkspacePaths::proofPicture(m_state);
     if (m_platform.files.fileExists(proof))
-        List3.append(proof);
+        m_sender.lists.List3.append(proof);
 }
 
-void FtpFrm::CountOrderPictures() {
-    List8.clear();
-    for (const QString& path : List3.items())
-        List8.append(LeafName(path));
-    m_state.shemot.TotalPics = sumOfCopies(List8.items(), CopiesIn::FileNames);
+void FtpFrm::countPictures() {
+    TextList& names = m_sender.lists.List8;
+    names.clear();
+    for (const QString& path : lists().List3.items())
+        names.append(LeafName(path));
+    m_state.shemot.TotalPics = CopiesCount(names.items());
     Label21.text = QString::number(m_state.shemot.TotalPics);
+    showCounts();
 }
 
 void FtpFrm::ShowOrderSummary() {
@@ -104,53 +75,50 @@ void FtpFrm::ShowOrderSummary() {
 }
 
 void FtpFrm::armCountdown() {
-    m_room->desk.pump();
-    CountOrderPictures();
-    NumToSend = static_cast<std::int16_t>(std::min(List3.count(), 32767));
-    if (List3.isEmpty()) {
-        enter(Phase::NoOrder);
+    m_platform.pump.pump();
+    countPictures();
+    if (lists().List3.isEmpty()) {
+        enter(SendingPhase::NoOrder);
         return;
     }
-    List4Makor.clear();
-    List4Makor.append(List3.items());
-    if (m_room->desk.left)
-        return;
-    Timer1.start();
-    enter(Phase::Countdown);
+    m_sender.beginOrder();
+    if (!m_sender.stop.left)
+        startCount();
 }
 
-void FtpFrm::Command13_Click() {
-    if (sending || !settingsFound())
+void FtpFrm::beginNewOrder() {
+    if (isUnderWay(phase()) || !settingsFound())
         return;
-    enter(Phase::Preparing);
+    enter(SendingPhase::Preparing);
     listFolder();
     armCountdown();
 }
 
-void FtpFrm::Command1_Click() {
-    if (sending)
+void FtpFrm::beginResend() {
+    if (isUnderWay(phase()))
         return;
     if (const QStringList lines = std::exchange(m_state.handOver.lines, {}); !lines.isEmpty())
         m_handedOver = lines;
     if (!settingsFound())
         return;
-    enter(Phase::Preparing);
-    beginList();
+    enter(SendingPhase::Preparing);
+    clearLists();
     m_chain.unload(PageId::MoogMeret);
-    if (!orderIsChosen()) {
+    const QString& folder = m_state.transfer.OrderFolder;
+    if (!IsOrderFolder(folder)) {
         Label7.text = QStringLiteral("0");
-        enter(Phase::NoOrder);
+        enter(SendingPhase::NoOrder);
         return;
     }
-    List3.append(m_handedOver);
-    Label7.text = QString::number(List3.count());
-    const QString& folder = m_state.transfer.OrderFolder;
-    ReadResentDetails(m_platform.files, OrderFolder(folder).logPath(), m_state.shemot);
+    FtpLists& lists = m_sender.lists;
+    lists.List3.append(m_handedOver);
+    Label7.text = QString::number(lists.List3.count());
+    ReadResentDetails(m_platform.files, OrderTextPath(folder), m_state.shemot);
     ShowOrderSummary();
     addProofPicture();
-    for (const QString& path : ReadBrokenFiles(m_platform.files, OrderFolder(folder))) {
-        if (List3.contains(path))
-            List4Broken.append(path);
+    for (const QString& path : ReadBrokenFiles(m_platform.files, folder)) {
+        if (lists.List3.contains(path))
+            lists.List4Broken.append(path);
     }
     armCountdown();
 }

@@ -2,10 +2,9 @@
 
 #include "common/DrivePathText.h"
 #include "order/BrokenFiles.h"
-#include "order/OrderFolder.h"
-#include "platform/Dialogs.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
 #include "platform/files/Files.h"
-#include "transfer/delivery/LineTrouble.h"
 
 #include <utility>
 
@@ -29,90 +28,81 @@ Failure noLine() {
 
 } // namespace
 
-bool CheckFtpSettings(const SessionState& state) {
-    return !state.profile.FtpUser.isEmpty() && !state.profile.FtpServer.isEmpty() &&
-           !state.profile.FtpPassword.isEmpty();
+bool CheckFtpSettings(const ClientProfile& profile) {
+    return !profile.FtpUser.isEmpty() && !profile.FtpServer.isEmpty() && !profile.FtpPassword.isEmpty();
 }
 
-FtpSession::FtpSession(FtpDesk& desk)
-    : m_desk(desk)
-    , m_board(desk.board) {}
+FtpSession::FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform,
+                       SendingEvents& events, SendingStop& stop, FtpLists& lists)
+    : m_profile(profile)
+    , m_transfer(transfer)
+    , m_platform(platform)
+    , m_events(events)
+    , m_stop(stop)
+    , m_lists(lists) {}
 
 void FtpSession::beginPass() {
     ConnectFails = 0;
     RoundNo = 0;
-    m_noLineTold = false;
+    m_noInternetTold = false;
     m_noSessionTold = false;
-    m_noListKeptTold = false;
+    m_notKeptTold = false;
 }
 
 void FtpSession::takeSettings() {
-    FtpHost = m_desk.state.profile.FtpServer;
-    FtpPass = m_desk.state.profile.FtpPassword;
-    FtpUser = m_desk.state.profile.FtpUser;
+    FtpHost = m_profile.FtpServer;
+    FtpPass = m_profile.FtpPassword;
+    FtpUser = m_profile.FtpUser;
 }
 
 void FtpSession::PauseBar(int times) {
-    m_board.Picture1.visible = m_desk.state.transfer.Mefurak == Travel::Whole;
-    for (int time = 0; time < times; ++time) {
-        for (int i = 1; i <= pauseRounds && !m_desk.left; ++i) {
-            m_board.Picture1Width = i / 6;
-            m_desk.pump();
-        }
-    }
+    for (int time = 0; time < times; ++time)
+        pauseInRounds(pauseRounds, m_events, m_platform.pump, m_stop);
+}
+
+void FtpSession::pump() {
+    m_platform.pump.pump();
 }
 
 void FtpSession::log(const QString& text) {
-    const QTime now = m_desk.platform.clock.now().time();
-    m_board.LogList.append(QString::number(now.hour()) + QString::number(now.minute()) + text);
+    const QTime now = m_platform.clock.now().time();
+    m_lists.LogList.append(QString::number(now.hour()) + QString::number(now.minute()) + text);
 }
 
-void FtpSession::tell(LineStep step, const Failure& failure, const QString& subject) {
-    m_board.Label4Reason.text = LineTroubleText(m_desk.state, step, failure, subject);
-    m_board.Label4Reason.hint = failure.message;
-    m_board.Label4Reason.visible = true;
-    m_desk.changed();
+void FtpSession::tellOnce(bool& told, SendingMoment moment, int number) {
+    if (!std::exchange(told, true))
+        tell(moment, number);
 }
 
 void FtpSession::FtpOpenInternet() {
     int i = 1;
     for (; i <= openAttempts; ++i) {
-        m_desk.pump();
-        if (m_desk.wholeFiles())
-            m_desk.status(m_desk.wording(QStringLiteral("  קשר ראשוני "), QStringLiteral("  First contact ")) +
-                          QString::number(i));
-        hOpen = m_desk.platform.internet.open();
+        pump();
+        tell(SendingMoment::Opening, i);
+        hOpen = m_platform.internet.open();
         if (hOpen) {
-            FtpEnableControls(true);
+            tell(SendingMoment::SessionOpen);
             return;
         }
         FtpCloseAll();
     }
-    tell(LineStep::Open, noLine());
-    if (!std::exchange(m_noLineTold, true))
-        m_desk.platform.dialogs.message(m_desk.wording(QStringLiteral("לא נוצר קשר אינטרנט לאחר מספר נסיונות"),
-                                                       QStringLiteral("No internet contact after several attempts: ")) +
-                                        QString::number(i));
-    FtpEnableControls(true);
+    m_events.failed(LineStep::Open, noLine());
+    tellOnce(m_noInternetTold, SendingMoment::NoInternet, i);
+    tell(SendingMoment::SessionOpen);
 }
 
 void FtpSession::FtpConnectServer() {
-    m_board.List1.clear();
+    m_lists.List1.clear();
     if (!bActiveSession && hOpen) {
-        const auto channel =
-            m_board.chkPassive.checked ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
+        const auto channel = passive ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
         int count = 0;
         Failure last = noLine();
-        while (count < connectAttempts && !hConnection && !m_desk.left && !m_desk.StopFlag) {
-            m_desk.pump();
-            if (m_desk.StopFlag)
+        while (count < connectAttempts && !hConnection && !m_stop.left && !m_stop.StopFlag) {
+            pump();
+            if (m_stop.StopFlag)
                 break;
-            ++count;
-            if (m_desk.wholeFiles())
-                m_desk.status(QString::number(count) +
-                              m_desk.wording(QStringLiteral("  נסיון ליצור קשר עם השרת  "),
-                                             QStringLiteral("  Trying to reach the server  ")));
-            auto connected = m_desk.platform.internet.connectFtp(FtpHost, FtpUser, FtpPass, channel);
+            tell(SendingMoment::Connecting, ++count);
+            auto connected = m_platform.internet.connectFtp(FtpHost, FtpUser, FtpPass, channel);
             if (connected)
                 hConnection = std::move(*connected);
             else
@@ -120,90 +110,78 @@ void FtpSession::FtpConnectServer() {
         }
         if (!hConnection) {
             bActiveSession = false;
-            if (m_desk.StopFlag)
+            if (m_stop.StopFlag)
                 return;
-            tell(LineStep::Connect, last);
-            m_desk.status(m_desk.wording(QStringLiteral("אין תקשורת עם השרת לאחר מספר נסיונות"),
-                                         QStringLiteral("No contact with the server after several attempts: ")) +
-                          QString::number(count));
+            m_events.failed(LineStep::Connect, last);
+            tell(SendingMoment::NotConnected, count);
             return;
         }
         bActiveSession = true;
-        m_board.List1.append(FtpHost);
+        m_lists.List1.append(FtpHost);
         ListRemote({});
         if (!colNames.isEmpty())
             FillListFromNames(Target::List1, {});
     }
-    if (m_desk.wholeFiles())
-        m_desk.status(
-            m_desk.wording(QStringLiteral("יצר קשר עם השרת"), QStringLiteral("Contact made with the server")));
+    tell(SendingMoment::Connected);
 }
 
-void FtpSession::reconnect(Captions captions) {
-    const auto follow = [&] {
-        if (captions == Captions::Follow)
-            m_desk.captionFollowsStatus();
-    };
+void FtpSession::walkToLabFolder() {
     FtpOpenInternet();
-    follow();
+    tell(SendingMoment::WalkStep);
     PauseBar();
     FtpConnectServer();
-    follow();
+    tell(SendingMoment::WalkStep);
     PauseBar();
     EnterFolderTK1();
-    follow();
+    tell(SendingMoment::WalkStep);
     EnterFolderTK2();
-    follow();
+    tell(SendingMoment::WalkStep);
 }
 
-void FtpSession::openFolder(const QString& name, Target target, Caption& asTold, Caption& withoutSlash) {
+void FtpSession::openFolder(const QString& name, int level) {
     ConnectFails = 0;
     RoundNo = 0;
-    m_board.Frame9.visible = false;
+    tell(SendingMoment::FolderFound);
     if (!bActiveSession) {
-        if (!std::exchange(m_noSessionTold, true))
-            m_desk.platform.dialogs.message(QStringLiteral("No in session!"));
+        tellOnce(m_noSessionTold, SendingMoment::NoSession);
         return;
     }
-    m_board.List2.clear();
+    m_lists.List2.clear();
     ListRemote(name);
-    FillListFromNames(target, name);
-    if (target == Target::List4 && m_desk.wholeFiles())
-        m_desk.status(
-            m_desk.wording(QStringLiteral("יוצר קשר בתוך השרת"), QStringLiteral("Making contact inside the server")));
-    asTold.text = CurrentRemoteDir();
-    MikumBaSharat = withoutFirstSlash(asTold.text);
-    withoutSlash.text = MikumBaSharat;
+    FillListFromNames(level == 1 ? Target::List4 : Target::List5, name);
+    if (level == 1)
+        tell(SendingMoment::InsideServer);
+    const QString asTold = CurrentRemoteDir();
+    MikumBaSharat = withoutFirstSlash(asTold);
+    m_events.enteredFolder(level, asTold, MikumBaSharat);
 }
 
 void FtpSession::EnterFolderTK1() {
-    const QString& name = m_desk.state.profile.FtpFolder1;
+    const QString& name = m_profile.FtpFolder1;
     if (name.isEmpty())
         return;
-    FolderOk = m_board.List1.contains(name);
+    FolderOk = m_lists.List1.contains(name);
     if (FolderOk)
-        openFolder(name, Target::List4, m_board.Label37, m_board.Label38);
+        openFolder(name, 1);
 }
 
 void FtpSession::EnterFolderTK2() {
-    const QString& name = m_desk.state.profile.FtpFolder2;
+    const QString& name = m_profile.FtpFolder2;
     if (name.isEmpty())
         return;
-    const bool below = !m_desk.state.profile.FtpFolder1.isEmpty();
-    FolderOk = (below ? m_board.List4 : m_board.List1).contains(name);
+    const bool below = !m_profile.FtpFolder1.isEmpty();
+    FolderOk = (below ? m_lists.List4 : m_lists.List1).contains(name);
     if (FolderOk) {
-        openFolder(name, Target::List5, m_board.Label40, m_board.Label41);
+        openFolder(name, 2);
     } else if (!below) {
         ++ConnectFails;
-        m_desk.status(m_desk.wording(QStringLiteral("תקשורת נכשלה מנסה שוב להתקשר"),
-                                     QStringLiteral("Communication failed, trying to connect again")));
+        tell(SendingMoment::FolderMissing);
     }
 }
 
 bool FtpSession::insideOrderBase() const {
-    const ClientProfile& profile = m_desk.state.profile;
     return MikumBaSharat ==
-           (profile.FtpFolder1.isEmpty() ? profile.FtpFolder2 : profile.FtpFolder1 + u'/' + profile.FtpFolder2);
+           (m_profile.FtpFolder1.isEmpty() ? m_profile.FtpFolder2 : m_profile.FtpFolder1 + u'/' + m_profile.FtpFolder2);
 }
 
 bool FtpSession::enterListedFolder(const QString& name) {
@@ -212,7 +190,7 @@ bool FtpSession::enterListedFolder(const QString& name) {
         return false;
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
-        tell(LineStep::OrderFolder, entered.failure());
+        m_events.failed(LineStep::OrderFolder, entered.failure());
         return false;
     }
     ListRemoteHere();
@@ -224,52 +202,48 @@ bool FtpSession::enterListedFolder(const QString& name) {
 }
 
 bool FtpSession::EnterOrderFolder() {
-    const QString ready =
-        m_desk.wording(QStringLiteral("מתכונן להעברת קבצים"), QStringLiteral("Preparing to transfer files"));
     m_inOrderFolder = false;
     if (!insideOrderBase()) {
-        m_desk.status(
-            m_desk.wording(QStringLiteral("מחוץ לתיקייה הרצוייה"), QStringLiteral("Outside the desired folder")));
+        tell(SendingMoment::OutsideFolder);
         return false;
     }
-    QString& name = m_desk.state.transfer.ShemTikiya;
-    name = OrderFolder::chosen(m_desk.state).name();
-    if (m_board.List5.contains(name)) {
+    QString& name = m_transfer.ShemTikiya;
+    name = LeafName(m_transfer.OrderFolder);
+    if (m_lists.List5.contains(name)) {
         if (!enterListedFolder(name))
             return false;
-        m_desk.status(m_desk.wording(QStringLiteral("מיד ממשיך בהעברת קבצים"),
-                                     QStringLiteral("Continuing the transfer at once")));
-        m_desk.pump();
-        m_desk.status(ready);
+        tell(SendingMoment::Continuing);
+        pump();
+        tell(SendingMoment::Ready);
         return true;
     }
     // What another folder held must not make a file of this one pass for sent.
-    m_board.List6.clear();
+    m_lists.List6.clear();
     FtpMakeOrderDir(name);
-    m_desk.pump();
+    pump();
     if (!bActiveSession || !hConnection) {
         log(QStringLiteral("after MakeRemoteDir"));
         return false;
     }
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
-        tell(LineStep::OrderFolder, entered.failure());
+        m_events.failed(LineStep::OrderFolder, entered.failure());
         return false;
     }
     m_inOrderFolder = true;
     FillListFromNames(Target::List2, name);
-    m_desk.status(ready);
+    tell(SendingMoment::Ready);
     return true;
 }
 
 void FtpSession::FtpMakeOrderDir(const QString& name) {
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
-        tell(LineStep::OrderFolder, made.failure());
+        m_events.failed(LineStep::OrderFolder, made.failure());
         log(QStringLiteral(" make remotedir fail"));
         return;
     }
-    m_board.List2.clear();
+    m_lists.List2.clear();
     ListRemoteChecked();
     FillListFromNames(Target::List2, name);
 }
@@ -282,27 +256,26 @@ bool FtpSession::FtpSendFile(const QString& path) {
         return false;
     }
     const QString name = LeafName(path);
-    m_desk.pump();
-    const Files& files = m_desk.platform.files;
+    pump();
+    const Files& files = m_platform.files;
     const auto local = files.drives().toHost(path);
     const auto sent = local && files.fileExists(path) ? hConnection->put(*local, name)
                                                       : Result<void>(Failure{Failure::Kind::NotFound, path});
-    m_desk.pump();
+    pump();
     if (sent)
         return true;
-    tell(LineStep::Put, sent.failure(), name);
+    m_events.failed(LineStep::Put, sent.failure(), name);
     log(QStringLiteral("fail to up load") + path);
-    m_board.List7.append(path);
+    m_lists.List7.append(path);
     PauseBar();
-    m_board.List4Broken.append(path);
+    m_lists.List4Broken.append(path);
     return false;
 }
 
 void FtpSession::keepBrokenFiles() {
-    const auto written =
-        WriteBrokenFiles(m_desk.platform.files, OrderFolder::chosen(m_desk.state), m_board.List4Broken);
-    if (!written && !std::exchange(m_noListKeptTold, true))
-        m_desk.platform.dialogs.message(written.failure().message);
+    const auto written = WriteBrokenFiles(m_platform.files, m_transfer.OrderFolder, m_lists.List4Broken);
+    if (!written && !std::exchange(m_notKeptTold, true))
+        m_events.brokenNotKept(written.failure());
 }
 
 void FtpSession::remove(const QString& remoteName) {
@@ -347,7 +320,7 @@ void FtpSession::ListRemoteHere() {
     if (found) {
         take(*found);
     } else {
-        tell(LineStep::List, found.failure());
+        m_events.failed(LineStep::List, found.failure());
         FtpFatalError(found.failure(), QStringLiteral("FtpFindFirstFile"));
     }
 }
@@ -361,7 +334,7 @@ void FtpSession::ListRemoteChecked() {
 
 bool FtpSession::FtpChangeDir(const QString& dir) {
     if (dir.isEmpty()) {
-        m_desk.platform.dialogs.message(QStringLiteral("Please enter the directory to CD"));
+        tell(SendingMoment::NoDirectory);
         return false;
     }
     QString target = dir;
@@ -370,9 +343,9 @@ bool FtpSession::FtpChangeDir(const QString& dir) {
     if (target.isEmpty())
         target = QStringLiteral("/");
     const auto changed = hConnection ? hConnection->setCurrentDirectory(target) : Result<void>(noLine());
-    m_board.Label5.text = target;
+    RemoteDirectory = target;
     if (!changed) {
-        tell(LineStep::OrderFolder, changed.failure());
+        m_events.failed(LineStep::OrderFolder, changed.failure());
         FtpFatalError(changed.failure(), QStringLiteral("rcd"));
     }
     return changed.ok();
@@ -387,33 +360,24 @@ void FtpSession::FillListFromNames(Target target, const QString& dir) {
     };
     switch (target) {
     case Target::List1:
-        m_board.List1.append(colNames);
+        m_lists.List1.append(colNames);
         break;
     case Target::List2:
         for (const QString& name : std::as_const(colNames)) {
-            m_board.List2.append(name);
-            m_board.List1.append(u'/' + name);
+            m_lists.List2.append(name);
+            m_lists.List1.append(u'/' + name);
         }
         break;
     case Target::List4:
-        refill(m_board.List4);
+        refill(m_lists.List4);
         break;
     case Target::List5:
-        refill(m_board.List5);
+        refill(m_lists.List5);
         break;
     case Target::List6:
-        refill(m_board.List6);
+        refill(m_lists.List6);
         break;
     }
-}
-
-void FtpSession::FtpEnableControls(bool enable) {
-    m_board.chkPassive.enabled = enable;
-    m_board.optBin.enabled = enable;
-    m_board.optAscii.enabled = enable;
-    m_board.cmdClosehOpen.visible = enable;
-    m_board.cmdInternetOpen.visible = !enable;
-    m_board.txtProxy.visible = !enable;
 }
 
 void FtpSession::FtpCloseConnection() {
@@ -421,7 +385,7 @@ void FtpSession::FtpCloseConnection() {
     m_inOrderFolder = false;
     ClearListing();
     bActiveSession = false;
-    FtpEnableControls(true);
+    tell(SendingMoment::SessionOpen);
 }
 
 void FtpSession::FtpCloseAll() {
@@ -433,45 +397,38 @@ void FtpSession::FtpCloseAll() {
 void FtpSession::closeSession() {
     FtpCloseAll();
     bActiveSession = false;
-    m_board.txtProxy.text.clear();
     ClearListing();
-    FtpEnableControls(false);
+    tell(SendingMoment::SessionClosed);
 }
 
 QString FtpSession::CurrentRemoteDir() {
     auto directory = hConnection ? hConnection->currentDirectory() : Result<QString>(noLine());
     if (!directory) {
-        m_desk.status(m_desk.wording(QStringLiteral("נותק הקשר"), QStringLiteral("The connection was cut")));
+        tell(SendingMoment::CutOff);
         return {};
     }
     return directory->left(directory->indexOf(QChar(u'\0')));
 }
 
-void FtpSession::FtpFatalError(const Failure& failure, const QString& source) {
-    Q_UNUSED(source);
+void FtpSession::takeResponse(const Failure& failure) {
     if (LineErrorNumber(failure.kind) == 12003 && hConnection)
         LastResponse = hConnection->lastResponse();
+}
+
+void FtpSession::FtpFatalError(const Failure& failure, const QString& source) {
+    Q_UNUSED(source);
+    takeResponse(failure);
     closeSession();
 }
 
-void FtpSession::FtpFatalErrorAsk(const Failure& failure, const QString& source) {
-    const int number = LineErrorNumber(failure.kind);
-    if (number == 12003 && hConnection)
-        LastResponse = hConnection->lastResponse();
-    const QString text = source + QStringLiteral(" Err: ") + QString::number(number) + QStringLiteral(" Extd Err: ") +
-                         LastResponse + QStringLiteral("\r\nClose Connection and Session?");
-    if (m_desk.platform.dialogs.ask(text))
-        closeSession();
-}
-
 void FtpSession::listHereAgain() {
-    m_board.List2.clear();
+    m_lists.List2.clear();
     ListRemoteHere();
     FillListFromNames(Target::List2, {});
 }
 
 void FtpSession::putHere(const QString& path) {
-    const auto local = m_desk.platform.files.drives().toHost(path);
+    const auto local = m_platform.files.drives().toHost(path);
     const auto sent = local && hConnection ? hConnection->put(*local, LeafName(path)) : Result<void>(noLine());
     if (!sent)
         FtpFatalError(sent.failure(), QStringLiteral("FtpPutFile"));
@@ -480,7 +437,7 @@ void FtpSession::putHere(const QString& path) {
 }
 
 void FtpSession::getHere(const QString& remoteName, const QString& localFolder) {
-    const auto local = m_desk.platform.files.drives().toHost(JoinDrivePath(localFolder, remoteName));
+    const auto local = m_platform.files.drives().toHost(JoinDrivePath(localFolder, remoteName));
     const auto got = local && hConnection ? hConnection->get(remoteName, *local) : Result<void>(noLine());
     if (!got)
         FtpFatalError(got.failure(), QStringLiteral("FtpGetFile"));

@@ -1,26 +1,31 @@
 #pragma once
 
+#include "common/Result.h"
 #include "platform/line/Internet.h"
-#include "transfer/ftp/FtpDesk.h"
+#include "session/SessionState.h"
+#include "transfer/delivery/Attempts.h"
+#include "transfer/ftp/FtpLists.h"
+
+#include <QStringList>
 
 #include <memory>
 #include <vector>
 
 namespace lumora {
 
-enum class LineStep;
+struct Platform;
 
-// The thin layer between the sending page and the FTP server: opens a session, connects, walks down to the lab's
-// folders, makes the order's folder, puts, lists, deletes. It never decides what to send. Each call blocks; between
-// calls events are pumped.
+// One FTP session with the lab's server: opens it, connects, walks down to the lab's folders, makes the order's folder,
+// puts, lists, deletes. It never decides what to send. Each call blocks; between calls events are pumped.
 //
 // Closed, then open (hOpen), connected (bActiveSession), in the order's folder, and closed again: the sender runs this
 // cycle once for each file and once for each check, so that a broken line never costs more than the file in hand.
 class FtpSession {
 public:
-    explicit FtpSession(FtpDesk& desk);
+    FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events,
+               SendingStop& stop, FtpLists& lists);
 
-    // A pass begins: its counters, and each box of a failed line may come once more.
+    // A pass begins: its counters, and each trouble that is told once a pass may be told again.
     void beginPass();
 
     // Host, user and password from the client profile.
@@ -30,9 +35,8 @@ public:
     void FtpConnectServer();
     void EnterFolderTK1();
     void EnterFolderTK2();
-    // FolderOk tells whether the walk succeeded. captions: the window's title follows the status line at each step.
-    enum class Captions { Follow, Stay };
-    void reconnect(Captions captions);
+    // The four above with their pauses. FolderOk tells whether the lab's folder was found.
+    void walkToLabFolder();
 
     // True if the walk has ended where order folders lie.
     bool insideOrderBase() const;
@@ -61,15 +65,9 @@ public:
 
     void FtpCloseConnection(); // the connection alone
     void FtpCloseAll();
-    void closeSession(); // both, and the controls that go with it
-    void FtpEnableControls(bool enable);
+    void closeSession(); // both
     QString CurrentRemoteDir();
-
-    // The system's only pause: rounds of repaint and event pumping, no clock.
     void PauseBar(int times = 1);
-
-    // Shows number, server's reply and a question whether to close. No caller.
-    void FtpFatalErrorAsk(const Failure& failure, const QString& source);
 
     // The manual panel: in the current remote directory. A failure ends the session.
     void putHere(const QString& path);
@@ -77,25 +75,31 @@ public:
     void removeHere(const QString& remoteName);
     void makeGoop();
 
+    // The server's own words at a refusal, fetched into LastResponse.
+    void takeResponse(const Failure& failure);
     // A line of LogList: hour and minute without a separator and without padding, then the text.
     void log(const QString& text);
-    void tell(LineStep step, const Failure& failure, const QString& subject = {});
 
     bool hOpen = false;
     std::unique_ptr<FtpConnection> hConnection;
     bool bActiveSession = false;
-    int dwType = 1; // transfer type ASCII; no other value ever reaches it
+    bool passive = true; // the server's side opens the data channel
+    int dwType = 1;      // transfer type ASCII; no other value ever reaches it
     QStringList colNames;
     std::vector<int> colAttrs; // 16 for a folder
     bool FolderOk = false;
     std::int16_t ConnectFails = 0;
     std::int16_t RoundNo = 0;
     QString FtpHost, FtpUser, FtpPass;
-    QString MikumBaSharat; // remote current directory without its leading slash
-    QString LastResponse;  // the server's own words at the last refusal
+    QString MikumBaSharat;   // remote current directory without its leading slash
+    QString RemoteDirectory; // the directory that was last asked for
+    QString LastResponse;    // the server's own words at the last refusal
 
 private:
-    void openFolder(const QString& name, Target target, Caption& asTold, Caption& withoutSlash);
+    void tell(SendingMoment moment, int number = 0) { m_events.reached(moment, number); }
+    void tellOnce(bool& told, SendingMoment moment, int number = 0);
+    void pump();
+    void openFolder(const QString& name, int level);
     bool FtpChangeDir(const QString& dir);
     void ClearListing();
     Result<std::vector<FtpEntry>> find();
@@ -103,16 +107,20 @@ private:
     void FtpFatalError(const Failure& failure, const QString& source);
     void listHereAgain();
 
-    FtpDesk& m_desk;
-    FtpBoard& m_board;
+    const ClientProfile& m_profile;
+    TransferState& m_transfer;
+    const Platform& m_platform;
+    SendingEvents& m_events;
+    SendingStop& m_stop;
+    FtpLists& m_lists;
     bool m_inOrderFolder = false;
-    // A pass asks for a session for each file; its boxes come once.
-    bool m_noLineTold = false;
+    // A pass opens a session for each file; these troubles are told once.
+    bool m_noInternetTold = false;
     bool m_noSessionTold = false;
-    bool m_noListKeptTold = false;
+    bool m_notKeptTold = false;
 };
 
 // True when the profile names a host, a user and a password.
-bool CheckFtpSettings(const SessionState& state);
+bool CheckFtpSettings(const ClientProfile& profile);
 
 } // namespace lumora

@@ -3,6 +3,7 @@
 #include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "order/BrokenFiles.h"
+#include "platform/Machine.h"
 
 #include <array>
 #include <vector>
@@ -32,7 +33,7 @@ constexpr int filterWalks = 3;
 void UploadCheck::check(int attempt) {
     m_freshListing = false;
     for (const Step step : stepsOf(attempt)) {
-        if (m_desk.left)
+        if (m_stop.left)
             return;
         switch (step) {
         case Step::Pause:
@@ -61,60 +62,54 @@ void UploadCheck::freshConnection() {
     m_session.PauseBar();
     m_session.FtpCloseConnection();
     m_session.PauseBar();
-    m_desk.pump();
+    m_pump.pump();
     m_session.PauseBar(3);
-    m_session.reconnect(FtpSession::Captions::Follow);
+    m_session.walkToLabFolder();
 }
 
 bool UploadCheck::lookUp() {
-    const QString& name = m_desk.state.transfer.ShemTikiya;
+    const QString& name = m_transfer.ShemTikiya;
     // One folder of that name can be entered, however often the listing has it.
-    return m_board.List5.contains(name) && m_session.enterListedFolder(name);
+    return m_lists.List5.contains(name) && m_session.enterListedFolder(name);
 }
 
 void UploadCheck::filterDots() {
     for (int walk = 0; walk < filterWalks; ++walk) {
-        const int count = m_board.List6.count();
+        const int count = m_lists.List6.count();
         for (int i = 0; i < count; ++i) {
-            const QString name = m_board.List6.item(i);
+            const QString name = m_lists.List6.item(i);
             if (name == QStringLiteral(".") || name == QStringLiteral(".."))
-                m_board.List6.removeAt(i);
+                m_lists.List6.removeAt(i);
         }
     }
 }
 
 void UploadCheck::count() {
     int names = 0;
-    for (const QString& name : m_board.List6.items()) {
-        if (!IsBroken(m_board.List4Broken, name))
+    for (const QString& name : m_lists.List6.items()) {
+        if (!IsBroken(m_lists.List4Broken, name))
             ++names;
     }
     NumOnServer = HoldIn16Bits(names);
 }
 
-void UploadCheck::tellCount(const QString& hebrew) {
-    m_desk.status(QString::number(NumOnServer) +
-                  m_desk.wording(hebrew, QStringLiteral(" files uploaded successfully ")));
-}
-
 void UploadCheck::ListServerFiles() {
     freshCount = false;
     freshConnection();
-    if (m_desk.left)
+    if (m_stop.left)
         return;
     if (!m_session.insideOrderBase()) {
-        m_desk.status(
-            m_desk.wording(QStringLiteral("מחוץ לתיקייה הרצוייה"), QStringLiteral("Outside the desired folder")));
+        m_events.reached(SendingMoment::OutsideFolder);
         return;
     }
     freshCount = lookUp();
     if (freshCount) {
         count();
-        tellCount(QStringLiteral("קבצים שהועלו בהצלחה"));
+        m_events.reached(SendingMoment::Listed, NumOnServer);
     }
     filterDots();
     count();
-    tellCount(QStringLiteral(" קבצים שהועלו בהצלחה "));
+    m_events.reached(SendingMoment::Counted, NumOnServer);
     m_session.FtpCloseConnection();
 }
 
@@ -123,14 +118,13 @@ void UploadCheck::RecheckBroken() {
     if (nothingBroken())
         return;
     freshConnection();
-    if (m_desk.left || !m_session.insideOrderBase())
+    if (m_stop.left || !m_session.insideOrderBase())
         return;
     m_freshListing = lookUp();
-    m_desk.status(
-        m_desk.wording(QStringLiteral("בודק קבצים שנכשלו"), QStringLiteral("Checking the files that failed")));
+    m_events.reached(SendingMoment::CheckingBroken);
     filterDots();
     count();
-    tellCount(QStringLiteral(" קבצים שהועלו בהצלחה "));
+    m_events.reached(SendingMoment::Counted, NumOnServer);
 }
 
 void UploadCheck::DeleteBrokenFiles() {
@@ -139,12 +133,12 @@ void UploadCheck::DeleteBrokenFiles() {
         return;
     m_session.CurrentRemoteDir();
     for (int walk = 0; walk < 2; ++walk) {
-        for (int i = 0; i < m_board.List4Broken.count() && !m_desk.left; ++i) {
-            m_board.List4Broken.setCurrentIndex(i);
-            m_session.remove(LeafName(m_board.List4Broken.item(i)).trimmed());
+        for (int i = 0; i < m_lists.List4Broken.count() && !m_stop.left; ++i) {
+            m_lists.List4Broken.setCurrentIndex(i);
+            m_session.remove(LeafName(m_lists.List4Broken.item(i)).trimmed());
             m_session.PauseBar();
-            m_desk.pump();
-            m_desk.pump();
+            m_pump.pump();
+            m_pump.pump();
         }
         if (walk == 0)
             m_session.PauseBar(2);
@@ -156,46 +150,46 @@ void UploadCheck::ConfirmBrokenGone() {
     if (nothingBroken() || !m_freshListing)
         return;
     m_session.PauseBar();
-    TextList& broken = m_board.List4Broken;
-    m_board.List4BrokenB.clear();
+    TextList& broken = m_lists.List4Broken;
+    m_lists.List4BrokenB.clear();
     for (const QString& path : broken.items())
-        m_board.List4BrokenB.append(LeafName(path));
-    for (int i = 0; i < m_board.List4BrokenB.count() && !broken.isEmpty(); ++i) {
-        const QString name = m_board.List4BrokenB.item(i);
+        m_lists.List4BrokenB.append(LeafName(path));
+    for (int i = 0; i < m_lists.List4BrokenB.count() && !broken.isEmpty(); ++i) {
+        const QString name = m_lists.List4BrokenB.item(i);
         int last = -1;
         for (int k = 0; k < broken.count(); ++k) {
             if (LeafName(broken.item(k)) == name)
                 last = k;
         }
-        if (!m_board.List6.contains(name))
+        if (!m_lists.List6.contains(name))
             broken.removeAt(last);
     }
-    if (broken.count() < m_board.List4BrokenB.count())
+    if (broken.count() < m_lists.List4BrokenB.count())
         m_session.keepBrokenFiles();
 }
 
 QStringList UploadCheck::missing() const {
     QStringList paths;
-    for (const QString& path : m_board.List4Makor.items()) {
+    for (const QString& path : m_lists.List4Makor.items()) {
         const QString name = LeafName(path);
-        if (!m_board.List6.contains(name) || IsBroken(m_board.List4Broken, name))
+        if (!m_lists.List6.contains(name) || IsBroken(m_lists.List4Broken, name))
             paths.append(path);
     }
     return paths;
 }
 
 void UploadCheck::RebuildMissing() {
-    if (NumOnServer >= m_board.List4Makor.count())
+    if (NumOnServer >= m_lists.List4Makor.count())
         return;
     const QStringList paths = missing();
-    m_board.List3.clear();
-    m_board.List3.append(paths);
+    m_lists.List3.clear();
+    m_lists.List3.append(paths);
 }
 
 void UploadCheck::DropAlreadySent() {
-    for (int i = m_board.List3.lastIndex(); i >= 0; --i) {
-        if (m_board.List6.contains(LeafName(m_board.List3.item(i))))
-            m_board.List3.removeAt(i);
+    for (int i = m_lists.List3.lastIndex(); i >= 0; --i) {
+        if (m_lists.List6.contains(LeafName(m_lists.List3.item(i))))
+            m_lists.List3.removeAt(i);
     }
 }
 

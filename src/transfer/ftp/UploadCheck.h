@@ -4,14 +4,18 @@
 
 namespace lumora {
 
-// What arrived: after each pass the check reconnects from scratch, takes the remains of failed puts off the server and
-// counts names. An order counts as sent when its folder on the server holds as many names as the order has files; the
-// listing is the only evidence, neither sizes nor dates are compared.
+// After each pass the check reconnects from scratch, deletes the remains of failed puts from the server and counts the
+// names in the order's folder. An order counts as sent when its folder on the server holds as many names as the order
+// has files; neither sizes nor dates are compared.
 class UploadCheck {
 public:
-    UploadCheck(FtpDesk& desk, FtpSession& session)
-        : m_desk(desk)
-        , m_board(desk.board)
+    UploadCheck(const TransferState& transfer, EventPump& pump, SendingEvents& events, SendingStop& stop,
+                FtpLists& lists, FtpSession& session)
+        : m_transfer(transfer)
+        , m_pump(pump)
+        , m_events(events)
+        , m_stop(stop)
+        , m_lists(lists)
         , m_session(session) {}
 
     // The steps that follow the pass of an attempt, 1 to 4. They differ in their pauses and closings alone.
@@ -37,12 +41,14 @@ private:
     bool lookUp();
     void filterDots();
     void count();
-    void tellCount(const QString& hebrew);
-    bool nothingBroken() const { return m_board.List4Broken.isEmpty() || m_board.List6.isEmpty(); }
+    bool nothingBroken() const { return m_lists.List4Broken.isEmpty() || m_lists.List6.isEmpty(); }
     void freshConnection();
 
-    FtpDesk& m_desk;
-    FtpBoard& m_board;
+    const TransferState& m_transfer;
+    EventPump& m_pump;
+    SendingEvents& m_events;
+    SendingStop& m_stop;
+    FtpLists& m_lists;
     FtpSession& m_session;
     bool m_freshListing = false; // List6 was read by the last RecheckBroken
 };

@@ -9,15 +9,20 @@ namespace lumora {
 // One walk over List3: each file on a session of its own, names that are on the server already skipped.
 class UploadPass {
 public:
-    UploadPass(FtpDesk& desk, FtpSession& session)
-        : m_desk(desk)
-        , m_board(desk.board)
+    UploadPass(const TransferState& transfer, const Platform& platform, SendingEvents& events, SendingStop& stop,
+               FtpLists& lists, FtpSession& session)
+        : m_transfer(transfer)
+        , m_platform(platform)
+        , m_events(events)
+        , m_stop(stop)
+        , m_lists(lists)
         , m_session(session) {}
 
     void run();
-    void UploadOneFile(const QString& path);
-    // The two boxes of a stop, and the page back at full size.
-    void tellStopped();
+    // The file at an index of List3.
+    void UploadOneFile(int index);
+    // A stop has been followed: the session is closed and the stop told.
+    void endStopped();
 
     std::int16_t UserStopped = 0;
     int CurrentIndex = -1;     // index in List3
@@ -26,15 +31,16 @@ public:
     bool FaultPressed = false; // read by nobody
 
 private:
-    void showProgress(int index);
-    void showPiece(int index, const QString& name);
-    void showFile(const QString& name);
+    void tellPiece(int index);
     void send(const QString& path);
+    void put(const QString& path, const QString& name);
     void closeWithPauses();
-    FtpSession::Captions captions() const;
 
-    FtpDesk& m_desk;
-    FtpBoard& m_board;
+    const TransferState& m_transfer;
+    const Platform& m_platform;
+    SendingEvents& m_events;
+    SendingStop& m_stop;
+    FtpLists& m_lists;
     FtpSession& m_session;
 };
 

@@ -1,42 +1,82 @@
 #pragma once
 
-#include "session/Caption.h"
-#include "session/Page.h"
-#include "session/TextList.h"
 #include "session/Ticker.h"
-#include "transfer/delivery/LineTrouble.h"
-#include "transfer/http/ServerList.h"
-#include "transfer/http/UploadScript.h"
+#include "transfer/delivery/SendingPage.h"
+#include "transfer/http/HttpSender.h"
 
 namespace lumora {
 
-class PageChain;
-struct Platform;
-struct SessionState;
+// What the page that sends by HTTP shows.
+struct UploadFormControls : SendingControls {
+    Caption TxtWeb{*this, u"TxtWeb"};         // the last answer, or the list file's text
+    Caption TxtFromWeb{*this, u"TxtFromWeb"}; // the list file's text
+    Caption TxtUrl{*this, u"TxtUrl"};         // the rest of the upload's query
 
-// The second sending page: puts one finished order folder on the lab's web server, file by file, and asks scripts there
-// which files arrived. The answer to an upload is never taken for success, only the server's list is. Three attempts go
-// by themselves; a further one takes a click. The local folder stays as it is but for the list fetched into it.
-class UploadForm : public Page {
+    static constexpr int Picture1FullWidth = 330;
+    Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // the countdown's panel
+    int Picture1Width = 0;
+    Caption Picture5{*this, u"Picture5", Caption::At::Hidden};
+    Caption Picture6{*this, u"Picture6", Caption::At::Hidden}; // the end panel
+    Caption Pic4Timer{*this, u"Pic4Timer", Caption::At::Hidden};
+    Caption Pic4Hamten{*this, u"Pic4Hamten", Caption::At::Hidden}; // the bar that runs in each pause
+    int Pic4HamtenWidth = 0;
+    static constexpr int PicSargel2Width = 1000;
+    int PicSargel1Width = 0; // 0 to PicSargel2Width
+
+    Caption Image4{*this, u"Image4"};
+    Caption Image5{*this, u"Image5", Caption::At::Hidden};       // send again
+    Caption Command2{*this, u"Command2", Caption::At::Hidden};   // refresh
+    Caption Command3{*this, u"Command3", Caption::At::Hidden};   // stop
+    Caption Command10{*this, u"Command10", Caption::At::Hidden}; // continue
+    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // enabled while files travel, and without a handler
+    Caption endClose{*this, u"endClose", Caption::At::Hidden};   // close, in the end
+
+    Caption Label1{*this, u"Label1"};                                // which attempt
+    Caption Label4{*this, u"Label4"};                                // index of the file that has been posted
+    Caption Label7{*this, u"Label7"};                                // percent
+    Caption Label8{*this, u"Label8"};                                // seconds of the countdown
+    Caption Label9{*this, u"Label9", Caption::At::Hidden};           // "sending"
+    Caption Label10{*this, u"Label10"};                              // the shop's telephone
+    Caption Label4Tel{*this, u"Label4Tel", Caption::At::Hidden};     // the same in a sentence
+    Caption Label11{*this, u"Label11", Caption::At::Hidden};         // "this order went up in full"
+    Caption Label12{*this, u"Label12"};                              // files left
+    Caption Label4Left{*this, u"Label4Left", Caption::At::Hidden};   // the same in a sentence
+    Caption Label13{*this, u"Label13"};                              // "the sending starts in"
+    Caption Label14{*this, u"Label14"};                              // "seconds"
+    Caption Label4Count{*this, u"Label4Count", Caption::At::Hidden}; // the countdown in a sentence, or Label11
+    Caption Label15{*this, u"Label15"};                              // name of the order folder
+    Caption Label16{*this, u"Label16"};                              // the same in the end panel
+    Caption Label4Rshom{*this, u"Label4Rshom"};                      // "write down the order number"
+    Caption Label4Alu{*this, u"Label4Alu"};                          // "the files went up"
+    Caption Label4Tashlum{*this, u"Label4Tashlum"};                  // "call the shop about payment"
+    Caption Label4Notru{*this, u"Label4Notru"};                      // "files left to send"
+    Caption Pic4Trouble{*this, u"Pic4Trouble", Caption::At::Hidden}; // the card of a trouble while the order is sent
+};
+
+// UploadForm, "sending an order by HTTP" in the glossary: the customer waits here while one finished order folder goes
+// to the lab's web server. Three attempts go by themselves; a further one takes a click. The local folder stays as it
+// is but for the list that is fetched into it.
+class UploadForm : public SendingPage, private UploadFormControls, private SendingEvents {
     Q_OBJECT
 public:
+    static constexpr PageId pageId = PageId::UploadForm;
+
     UploadForm(SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;
 
     // Events.
-    void Form_Activate();   // the page has come up
-    void Timer1_Tick();     // the panel grows
-    void Timer2_Tick();     // one second of the countdown
-    void Command2_Click();  // refresh the list
-    void Command4_Click();  // what is missing on the server
-    void Command3_Click();  // stop the sending
-    void Command10_Click(); // continue the sending
-    void Command28_Click(); // a new order
-    void Image5_Click();    // up to three attempts, anew
-    void Image3_Click();    // close
+    void Timer1_Tick() { growPanel(); }
+    void Timer2_Tick() { countSecond(); }
+    void Command2_Click() { refreshList(); }
+    void Command4_Click() { findMissing(); }
+    void Command3_Click() { stopCount(); }
+    void Command10_Click() { goOn(); }
+    void Command28_Click() { leaveForAnother(); }
+    void Image5_Click() { sendAgain(); }
+    void Image3_Click() { leaveProgram(); }
 
-    // Events of the hidden area: the makers' test buttons.
+    // Events that no control sends, the lab's tests of its scripts; UploadFormUnused.cpp.
     void Command1_Click(); // "Upload File"
     void Command5_Click();
     void Command6_Click(); // "GetUrlSource"
@@ -44,112 +84,51 @@ public:
     void Command8_Click();
 
     // State.
-    TextList List4Kvazim;   // every file of the order folder, full paths
-    TextList List4Hossarim; // the files still missing, full paths
-    TextList ListAfterWeb;  // entries of the last listing
-    TextList ListInOrder;   // entries of the list file
-    Caption TxtWeb;         // the last answer, or the list file's text
-    Caption TxtFromWeb;     // the list file's text
-    Caption TxtUrl;         // the rest of the upload's query
-    QString caption;        // title of the window
-
-    static constexpr int Picture1FullWidth = 330;
-    Caption Picture1; // the countdown's panel
-    int Picture1Width = 0;
-    Caption Picture5;
-    Caption Picture6; // the end panel
-    Caption Pic4Timer;
-    Caption Pic4Hamten; // the bar that runs in each pause
-    int Pic4HamtenWidth = 0;
-    static constexpr int PicSargel2Width = 1000;
-    int PicSargel1Width = 0; // 0 to PicSargel2Width
-    int percent = 0;
-    Caption Image3; // close
-    Caption Image4;
-    Caption Image5;        // send now, or again
-    Caption Command2;      // refresh
-    Caption Command3;      // stop
-    Caption Command10;     // continue
-    Caption Command28;     // a new order; shown in the end states
-    Caption Command15;     // enabled while files travel, and without a handler
-    Caption Label1;        // which attempt
-    Caption Label4;        // index of the file that travels
-    Caption Label7;        // percent
-    Caption Label8;        // seconds of the countdown
-    Caption Label9;        // "sending"
-    Caption Label10;       // the shop's telephone
-    Caption Label11;       // "this order went up in full"
-    Caption Label12;       // files left
-    Caption Label13;       // "the sending starts in"
-    Caption Label14;       // "seconds"
-    Caption Label15;       // name of the order folder
-    Caption Label16;       // the same in the end panel
-    Caption Label4Rshom;   // "write down the order number"
-    Caption Label4Alu;     // "the files went up"
-    Caption Label4Tashlum; // "call the shop about payment"
-    Caption Label4Notru;   // "files left to send"
-    Caption Label4File;    // "file 3 of 17: name"; empty while nothing travels
-    Caption Label4Do;      // what the customer can do now
-    Caption Label4Reason;  // what the last failure of the line means
-    Ticker Timer1;         // 1 ms
-    Ticker Timer2;         // 1000 ms
-    bool sending = false;
-    bool verifying = false; // every file has gone, and the server is asked which have arrived
-    bool done = false;      // all has arrived
-    bool failed = false;    // three attempts were not enough, or nothing can be sent
+    const UploadFormControls& controls() const override { return *this; }
+    const HttpLists& lists() const { return m_sender.lists; }
+    bool counting() const { return Timer1.running() || Timer2.running(); } // the panel grows or the seconds run
 
     // The signal is Page::changed().
 
 private:
-    enum class Phase {
-        Checking,
-        NoOrder,
-        NoServer,
-        Countdown,
-        Stopped,
-        Sending,
-        Verifying,
-        Reporting,
-        Success,
-        AllThere,
-        NotAll,
-    };
-
-    void activateWhenFree();
-    void enter(Phase phase);
-    void showWhatToDo();
-    void leavePage();
+    void begin() override;
+    void leave() override;
     bool idle() const;
-    void pump();
-    void BuildOrderFileList();
+    void growPanel();
+    void countSecond();
+    void stopTimers();
     void startPanel();
-    void takeAllAsMissing();
-    void showMissingCount();
-    QString folderName() const;
-    QString siteAddress(const QString& rest) const;
+    void refreshList();
+    void findMissing();
+    void stopCount();
+    void goOn();
+    void sendAgain();
+    void sendMissing();
+    void succeed();
+    void leaveForAnother();
 
-    void HttpAttempts();
-    void HttpSendFiles(int listNumber);
-    void ShowHttpProgress();
-    void HttpPause(int times = 1);
-    ServerVerdict CheckOrderOnServer(int listNumber);
-    void HttpFetchFileListN(int listNumber);
-    void HttpSendReport();
-    void HttpSendDone();
-    QString FetchUrl(const QString& url);
-    void finishSuccess();
-    void tellReason(LineStep step, const Failure& failure, const QString& file = {});
-    LineStep listTrouble() const;
+    // UploadFormTexts.cpp
+    const PhaseLook& lookOf(SendingPhase phase) const override;
+    void showPhase(const PhaseLook& row) override;
+    void showCount();
+    void showTrouble();
+    void showLeft(int files);
+    void showAnswers();
 
-    SessionState& m_state;
-    const Platform& m_platform;
-    PageChain& m_chain;
-    UploadScript m_script;
-    Failure m_listFailure; // of the last list file that was asked for; no message when it was fetched
-    Phase m_phase = Phase::Checking;
-    bool m_activated = false;
-    bool m_busy = false; // a check runs
-    bool m_left = false; // the customer has left: every loop ends at its next step
+    // UploadFormEvents.cpp
+    void reached(SendingMoment moment, int number) override;
+    void progressed(int index, int count) override;
+    void sending(int index, int count, const QString& name) override;
+    void pieceSent(double, std::optional<int>) override {}
+    void failed(LineStep step, const Failure& failure, const QString& subject) override;
+    void brokenNotKept(const Failure&) override {}
+    void enteredFolder(int, const QString&, const QString&) override {}
+    void pausing(int round) override;
+
+    Ticker Timer1; // 1 ms: the panel grows
+    Ticker Timer2; // 1000 ms: the countdown
+    HttpSender m_sender;
+    bool m_busy = false; // a check runs that is no part of an attempt
 };
 
 } // namespace lumora

@@ -25,9 +25,9 @@ QString InetForm::FetchUrlSmall(const QString& url) {
     return body ? AnsiCodePage::decode(*body) : QString();
 }
 
-void InetForm::Command1_Click() {
+void InetForm::reportOrder() {
     m_platform.pump.pump();
-    const QString query = OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
+    const QString query = OrderReportQuery(m_state);
     const QString& script = m_state.profile.ReportUrl;
     // The lab's site is used to a call of this address before each report.
     TeshuvatSharat = FetchUrlSmall(script + QStringLiteral("c.txt"));
@@ -35,8 +35,8 @@ void InetForm::Command1_Click() {
     Q_EMIT changed();
 }
 
-void InetForm::Command2_Click() {
-    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state.profile, m_state.transfer));
+void InetForm::reportDone() {
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state));
     Q_EMIT changed();
 }
 

@@ -9,8 +9,9 @@ class PageChain;
 struct Platform;
 struct SessionState;
 
-// A page that nobody sees: its buttons tell the lab's web site that an order has arrived. The answers are stored and
-// read by nobody, and a report that is lost changes nothing: the order is on the server already.
+// InetForm, "the two reports" in the glossary: a page that nobody sees, by which the sending page tells the lab's web
+// site that an order has arrived. The answers are stored and read by nobody, and a report that is lost changes nothing:
+// the order is on the server already.
 class InetForm : public Page {
     Q_OBJECT
 public:
@@ -19,20 +20,25 @@ public:
     InetForm(SessionState& state, const Platform& platform, PageChain& chain);
 
     // Events.
-    void Command1_Click();   // the order report
-    void Command2_Click();   // the done call
+    void Command1_Click() { reportOrder(); }
+    void Command2_Click() { reportDone(); }
     void Command4_Click() {} // "pricelist"
     void cmdLoad_Click() {}  // "Load"
 
+    // The order report and the done call.
+    void reportOrder();
+    void reportDone();
+
     // State.
-    QString TeshuvatSharat; // answer of the last call
+    const QString& answer() const { return TeshuvatSharat; } // of the last call
 
     // The body behind a URL, past every cache; empty when there is none. Without a line a box tells so.
     QString FetchUrlSmall(const QString& url);
 
 private:
-    SessionState& m_state;
+    const SessionState& m_state;
     const Platform& m_platform;
+    QString TeshuvatSharat;
 };
 
 // Fetches a URL to a file under a drive path. True unless the path names no place on this machine: the download's own

@@ -46,10 +46,11 @@ void Gauge::paintEvent(QPaintEvent*) {
     const double side = std::min(width(), height()) - thick - 2;
     QRectF ring(0, 0, side, side);
     ring.moveCenter(QRectF(rect()).center());
-    const QColor colour = m_mood == Mood::Good   ? Theme::Colour::Good
-                          : m_mood == Mood::Bad  ? Theme::Colour::Danger
-                          : m_mood == Mood::Held ? Theme::Colour::Edge
-                                                 : Theme::Colour::Primary;
+    const QColor colour = m_mood == Mood::Good      ? Theme::Colour::Good
+                          : m_mood == Mood::Bad     ? Theme::Colour::Danger
+                          : m_mood == Mood::Held    ? Theme::Colour::Edge
+                          : m_mood == Mood::Unclear ? Theme::Colour::Sun
+                                                    : Theme::Colour::Primary;
     painter.setPen(QPen(Theme::Colour::Sunken, thick));
     painter.drawEllipse(ring);
     painter.setPen(QPen(colour, thick, Qt::SolidLine, Qt::RoundCap));
@@ -57,7 +58,10 @@ void Gauge::paintEvent(QPaintEvent*) {
         painter.drawArc(ring, 90 * 16, -static_cast<int>(m_share * 360 * 16));
     if (m_mood != Mood::Busy) {
         const int size = static_cast<int>(side * 0.5);
-        const QString sign = m_mood == Mood::Good ? u"tick"_s : m_mood == Mood::Bad ? u"warning"_s : u"pause"_s;
+        const QString sign = m_mood == Mood::Good      ? u"tick"_s
+                             : m_mood == Mood::Bad     ? u"warning"_s
+                             : m_mood == Mood::Unclear ? u"info"_s
+                                                       : u"pause"_s;
         drawIcon(painter, ring.center(), m_theme.icon(sign, size, colour));
         return;
     }

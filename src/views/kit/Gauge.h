@@ -10,7 +10,7 @@ namespace lumora {
 class Gauge : public QWidget {
     Q_OBJECT
 public:
-    enum class Mood { Busy, Held, Good, Bad };
+    enum class Mood { Busy, Held, Unclear, Good, Bad };
     Gauge(const Theme& theme, QWidget* parent);
 
     // share 0 to 1; the small line stands below the large one.

@@ -1,17 +1,15 @@
 #pragma once
 
 #include "transfer/ftp/FtpFrm.h"
-#include "views/window/PageView.h"
+#include "views/sending/SendingView.h"
 
-class QFrame;
 class QProgressBar;
 
 namespace lumora {
 
-class Gauge;
 class PictureBox;
 
-class FtpFrmView : public PageView {
+class FtpFrmView : public SendingView {
     Q_OBJECT
 public:
     FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files);
@@ -25,39 +23,24 @@ private:
     QWidget* makeSide();
     void makeBars();
     void makePanels();
-    void bindTheRest();
-    void moveFocus(bool sending, QWidget* mainAction);
+    void showProof();
 
     FtpFrm& m_page;
-    bool m_wasSending = false;
+    const FtpFrmControls& m_shown;
     const Files& m_files;
-    Gauge* m_gauge = nullptr;
     QProgressBar* m_pieces = nullptr;
     QWidget* m_minutes = nullptr;
-    QLabel* m_minutesUnit = nullptr;
-    QFrame* m_failure = nullptr;
-    QLabel* m_failureLine = nullptr;
-    QLabel* m_successLine = nullptr;
     QFrame* m_summary = nullptr;
     QLabel* m_summaryLines = nullptr;
     QFrame* m_order = nullptr;
-    QLabel* m_orderHead = nullptr;
     QLabel* m_orderName = nullptr;
-    QLabel* m_counts = nullptr;
     QFrame* m_delivery = nullptr;
     PictureBox* m_proof = nullptr;
     QString m_proofFile;
     QPushButton* m_sendNow = nullptr;
-    QPushButton* m_sendAgain = nullptr;
-    QPushButton* m_newOrder = nullptr;
-    QPushButton* m_stop = nullptr;
     QPushButton* m_count = nullptr;
-    QPushButton* m_exit = nullptr;
-    QLabel* m_status = nullptr;
     Overlay* m_leave = nullptr;
-    QLabel* m_leaveText = nullptr;
-    Overlay* m_hiddenArea = nullptr;
-    std::vector<std::pair<QLabel*, std::pair<QString, QString>>> m_listTitles;
+    Overlay* m_labArea = nullptr;
 };
 
 } // namespace lumora

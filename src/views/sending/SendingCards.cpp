@@ -1,6 +1,5 @@
 #include "views/sending/SendingCards.h"
 
-#include "views/kit/Gauge.h"
 #include "views/kit/Maker.h"
 
 #include <QFrame>
@@ -42,17 +41,6 @@ QHBoxLayout* layOutSending(const Theme& theme, QWidget* progress, QWidget* side)
     row->addWidget(progress, 3);
     row->addWidget(side, 2);
     return row;
-}
-
-ProgressColumn makeProgressColumn(const Theme& theme, QWidget* parent) {
-    auto* box = new QWidget(parent);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme.px(10));
-    column->addStretch(1);
-    auto* gauge = new Gauge(theme, box);
-    column->addWidget(gauge, 6, Qt::AlignCenter);
-    return {box, column, gauge};
 }
 
 SendingCard CardColumn::add(const char* role) const {

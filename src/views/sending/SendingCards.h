@@ -8,8 +8,6 @@ class QVBoxLayout;
 
 namespace lumora {
 
-class Gauge;
-
 // What the two sending pages are put together from.
 
 struct SendingCard {
@@ -23,14 +21,6 @@ SendingCard makeSignedCard(const Theme& theme, QWidget* parent, const char* role
 
 // The two halves of the page: how the sending stands, and what it is about.
 QHBoxLayout* layOutSending(const Theme& theme, QWidget* progress, QWidget* side);
-
-// The half of the progress, with the gauge on top; what follows is added to the column.
-struct ProgressColumn {
-    QWidget* box;
-    QVBoxLayout* column;
-    Gauge* gauge;
-};
-ProgressColumn makeProgressColumn(const Theme& theme, QWidget* parent);
 
 // The other half, cards below one another.
 struct CardColumn {

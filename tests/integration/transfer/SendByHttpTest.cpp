@@ -58,7 +58,8 @@ protected:
 
 TEST_F(SendByHttp, TheOrderArrivesByteForByteWithOneReportAndOneDoneCall) {
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString() << page.TxtWeb.text.toStdString();
+    EXPECT_TRUE(hasArrived(page.phase()))
+        << page.controls().Label4Reason.hint.toStdString() << page.controls().TxtWeb.text.toStdString();
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
     const QByteArrayList reports = lab.reports();
     ASSERT_EQ(reports.size(), 2);
@@ -71,7 +72,8 @@ TEST_F(SendByHttp, ASecondKindOfServerTakesTheSameRequest) {
     ASSERT_TRUE(second.running()) << second.failure().toStdString();
     rig.state.profile.HttpHost = second.site();
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString() << page.TxtWeb.text.toStdString();
+    EXPECT_TRUE(hasArrived(page.phase()))
+        << page.controls().Label4Reason.hint.toStdString() << page.controls().TxtWeb.text.toStdString();
     EXPECT_EQ(filesIn(order(second.uploads())), rig.localFiles());
 }
 
@@ -81,7 +83,7 @@ TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
     rig.start();
     relay.setFaults({.cutDataAfter = 20, .times = 2});
     rig.countDown();
-    EXPECT_TRUE(rig.page().done) << rig.page().Label4Reason.hint.toStdString();
+    EXPECT_TRUE(hasArrived(rig.page().phase())) << rig.page().controls().Label4Reason.hint.toStdString();
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
 }
 
@@ -90,15 +92,15 @@ TEST_F(SendByHttp, AServerThatAnswers500EndsInTheThreeAttemptsAndSendAgainStarts
     QFile inTheWay(toText(order(lab.uploads())));
     ASSERT_TRUE(inTheWay.open(QIODevice::WriteOnly));
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.failed);
-    EXPECT_TRUE(page.Image5.visible);
-    EXPECT_EQ(page.Label12.text, u"5"_s);
-    EXPECT_EQ(page.Label10.text, u"00-0000000"_s);
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_TRUE(page.controls().Image5.visible);
+    EXPECT_EQ(page.controls().Label12.text, u"5"_s);
+    EXPECT_EQ(page.controls().Label10.text, u"00-0000000"_s);
     EXPECT_TRUE(lab.reports().isEmpty());
     EXPECT_EQ(lab.requests().join(" ").count("POST "), 15);
     ASSERT_TRUE(inTheWay.remove());
     page.Image5_Click();
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
     EXPECT_EQ(lab.reports().size(), 2);
 }
@@ -122,12 +124,12 @@ TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
     UploadForm& page = rig.send();
     stop = true;
     closing.join();
-    EXPECT_TRUE(page.failed);
-    EXPECT_TRUE(page.Label4Reason.visible);
-    EXPECT_EQ(page.List4Hossarim.count(), 5);
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_TRUE(page.controls().Label4Reason.visible);
+    EXPECT_EQ(page.lists().List4Hossarim.count(), 5);
     rig.state.profile.HttpHost = lab.site();
     page.Image5_Click();
-    EXPECT_TRUE(page.done) << page.Label4Reason.hint.toStdString();
+    EXPECT_TRUE(hasArrived(page.phase())) << page.controls().Label4Reason.hint.toStdString();
     EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
 }
 
@@ -136,11 +138,11 @@ TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
     const QString inTheWay = UploadFormRig::folder() + u'\\' + UploadFormRig::list();
     ASSERT_TRUE(rig.test.files.makeFolder(inTheWay));
     UploadForm& page = rig.send();
-    EXPECT_TRUE(page.failed);
-    EXPECT_EQ(page.Label4Reason.text, LineTroubleText(rig.state, LineStep::KeepList, {}));
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_EQ(page.controls().Label4Reason.text, LineTroubleText(rig.state, LineStep::KeepList, {}));
     ASSERT_TRUE(std::filesystem::remove(*rig.test.drives.toHost(inTheWay)));
     page.Image5_Click();
-    EXPECT_TRUE(page.done);
+    EXPECT_TRUE(hasArrived(page.phase()));
 }
 
 TEST_F(SendByHttp, AHebrewNameArrivesInTheCodePageAndNoNameLeadsElsewhere) {

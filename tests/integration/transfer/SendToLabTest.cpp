@@ -132,8 +132,8 @@ class FaultsOfTheLine : public SendToLab, public ::testing::WithParamInterface<L
 TEST_F(SendToLab, AnOrderArrivesByteForByteAndTheLabsSiteIsTold) {
     const auto before = localOrder();
     rig.send();
-    EXPECT_EQ(rig.page().Label3.text, uploaded);
-    EXPECT_EQ(rig.page().Label34.text, QString());
+    EXPECT_EQ(rig.page().controls().Label3.text, uploaded);
+    EXPECT_EQ(rig.page().controls().Label34.text, QString());
     EXPECT_EQ(puts(), FtpFrmRig::names());
     expectArrived();
     EXPECT_TRUE(localOrder() == before);
@@ -155,7 +155,7 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
         rig.state.profile.ReportOn = 0;
         rig.takeUpAgain({FtpFrmRig::first()});
         rig.send();
-        ASSERT_EQ(rig.page().Label3.text, uploaded);
+        ASSERT_EQ(rig.page().controls().Label3.text, uploaded);
         rig.chain.unload(PageId::FtpFrm);
         ASSERT_TRUE(std::filesystem::remove(remoteFolder() / "000.jpg"));
         rig.state.profile.ReportOn = 1;
@@ -166,15 +166,15 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
     FtpFrm& page = rig.start();
     if (!fault.backAt.isEmpty()) {
         QObject::connect(&page, &Page::changed, &page, [this, &page, &fault] {
-            if (page.Label34.text == fault.backAt)
+            if (page.controls().Label34.text == fault.backAt)
                 relay.setFaults({});
         });
     }
     rig.countDown();
-    EXPECT_EQ(page.Label3.text, fault.success ? uploaded : notAll);
-    EXPECT_EQ(page.Label34.text, fault.attempt);
-    EXPECT_EQ(page.Picture6.visible, !fault.success);
-    EXPECT_EQ(page.Command10.visible, !fault.success);
+    EXPECT_EQ(page.controls().Label3.text, fault.success ? uploaded : notAll);
+    EXPECT_EQ(page.controls().Label34.text, fault.attempt);
+    EXPECT_EQ(page.controls().Picture6.visible, !fault.success);
+    EXPECT_EQ(page.controls().Command10.visible, !fault.success);
     EXPECT_EQ(puts().size() - earlier, fault.puts);
     EXPECT_TRUE(localOrder() == before) << "the local folder changed";
     EXPECT_EQ(lab.requests(fault.success ? 3 : 0).size(), fault.success ? 3 : 0);
@@ -182,8 +182,8 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
         expectArrived();
         return;
     }
-    EXPECT_EQ(page.Label4Missing.text, QString::number(fault.neverArrives.size()));
-    EXPECT_FALSE(page.Label2.text.isEmpty());
+    EXPECT_EQ(page.controls().Label4Missing.text, QString::number(fault.neverArrives.size()));
+    EXPECT_FALSE(page.controls().Label2.text.isEmpty());
     const auto there = arrived();
     for (const QString& name : fault.neverArrives)
         EXPECT_FALSE(there.count(name)) << name.toStdString();
@@ -193,7 +193,7 @@ TEST_P(FaultsOfTheLine, EndAsTheCustomerIsToldAndAResendSendsOnlyWhatIsMissing) 
     rig.state.profile.FtpPassword = LabServers::password();
     const auto failed = puts().size();
     resend();
-    EXPECT_EQ(rig.page().Label3.text, uploaded);
+    EXPECT_EQ(rig.page().controls().Label3.text, uploaded);
     EXPECT_EQ(puts().mid(failed), fault.neverArrives);
     expectArrived();
     EXPECT_EQ(lab.requests(3).size(), 3);

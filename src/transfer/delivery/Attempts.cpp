@@ -1,0 +1,32 @@
+#include "transfer/delivery/Attempts.h"
+
+#include "platform/Machine.h"
+
+namespace lumora {
+
+void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const SendingStop& stop) {
+    for (int round = 1; round <= rounds && !stop.left; ++round) {
+        events.pausing(round);
+        pump.pump();
+    }
+}
+
+std::optional<SendingPhase> Attempts::run(int attempts, SendingMoment beginning) {
+    for (int attempt = 1; attempt <= attempts; ++attempt) {
+        m_events.reached(beginning, attempt);
+        const bool passed = sendMissing(attempt);
+        if (m_stop.left)
+            return std::nullopt;
+        if (!passed)
+            return SendingPhase::Stopped;
+        m_events.reached(SendingMoment::CheckBegins);
+        const std::optional<SendingPhase> end = checkArrival(attempt);
+        if (m_stop.left)
+            return std::nullopt;
+        if (end)
+            return end;
+    }
+    return afterTheLast();
+}
+
+} // namespace lumora

@@ -1,0 +1,67 @@
+#include "transfer/delivery/OrderFiles.h"
+
+#include "common/DrivePathText.h"
+#include "order/OrderNames.h"
+#include "order/PieceName.h"
+#include "platform/files/Files.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+namespace {
+
+// A folder's path of fewer characters is none.
+constexpr int shortestFolder = 4;
+
+} // namespace
+
+bool IsOrderFolder(const QString& folder) {
+    return !folder.isEmpty() && LeafName(folder) != notChosen;
+}
+
+QStringList FtpOrderFiles(const Files& files, const QString& folder, const QStringList& entries, bool inPieces) {
+    QStringList paths;
+    if (const QString log = OrderTextPath(folder); files.fileExists(log))
+        paths += log;
+    const auto append = [&](const QString& name) { paths += JoinDrivePath(folder, name); };
+    if (inPieces) {
+        const auto sheet = std::find_if(entries.begin(), entries.end(), IsSheet);
+        append(sheet == entries.end() ? QString() : *sheet);
+    }
+    for (const QString& name : entries) {
+        if (!inPieces || IsPiece(name))
+            append(name);
+    }
+    return paths;
+}
+
+QStringList BulkFiles(const QStringList& handedOver, bool inPieces) {
+    if (!inPieces)
+        return handedOver;
+    QStringList texts;
+    QStringList pieces;
+    QString sheet;
+    for (const QString& path : handedOver) {
+        if (path.endsWith(QStringLiteral("txt")))
+            texts += path;
+        else if (path.endsWith(QStringLiteral("prk")))
+            pieces += path;
+        if (sheet.isEmpty() && IsSheet(LeafName(path)))
+            sheet = path;
+    }
+    if (!sheet.isEmpty())
+        texts += sheet;
+    return texts + pieces;
+}
+
+QStringList HttpOrderFiles(const Files& files, const QString& folder, const QString& serverList) {
+    const QString path = folder.trimmed();
+    if (path.size() < shortestFolder)
+        return {};
+    QStringList paths = files.collect(path, Files::Depth::ThisFolder);
+    paths.removeIf([&](const QString& each) { return LeafName(each).compare(serverList, Qt::CaseInsensitive) == 0; });
+    return paths;
+}
+
+} // namespace lumora

@@ -1,0 +1,113 @@
+#include "transfer/delivery/SendingPage.h"
+
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+#include <QTimer>
+
+namespace lumora {
+
+namespace {
+
+constexpr int whileAPumpRuns = 20; // milliseconds
+
+} // namespace
+
+SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain,
+                         SendingControls& shown, Countdown countdown)
+    : Page(id)
+    , m_state(state)
+    , m_platform(platform)
+    , m_chain(chain)
+    , m_countdown(countdown)
+    , m_shown(shown) {
+    connect(&chain, &PageChain::shown, this, [this](Page* page) {
+        if (page == this)
+            QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
+    });
+    // The window may be closed, and the page unloaded, while a sending runs inside a pump: it must not go on unseen.
+    connect(&chain, &PageChain::ended, this, [this] { leave(); });
+    connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
+        if (page == this)
+            leave();
+    });
+}
+
+// Inside the pump of a page that still hands over, clicks would not get through to this one.
+void SendingPage::activateWhenFree() {
+    if (m_platform.pump.pumping())
+        QTimer::singleShot(whileAPumpRuns, this, &SendingPage::activateWhenFree);
+    else
+        Form_Activate();
+}
+
+void SendingPage::Form_Activate() {
+    if (m_activated)
+        return;
+    m_activated = true;
+    begin();
+}
+
+QString SendingPage::wording(const char16_t* hebrew, const char16_t* english) const {
+    return m_state.wording(hebrew, english);
+}
+
+QString SendingPage::advice(const PhaseLook& row) const {
+    return wording(row.advice);
+}
+
+void SendingPage::enter(SendingPhase phase) {
+    m_phase = phase;
+    tellPhase();
+    Q_EMIT changed();
+}
+
+void SendingPage::tellPhase() {
+    const PhaseLook& row = look();
+    m_shown.Label4Title.text = wording(row.title);
+    m_shown.Label4Do.text = advice(row);
+    m_shown.Label4Order.text = wording(u"ההזמנה שלך", u"Your order");
+    m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
+    showPhase(row);
+}
+
+SendingGauge SendingPage::gauge() const {
+    const SendingSign sign = look().sign;
+    switch (sign) {
+    case SendingSign::Seconds:
+        return {sign, m_countdown.share(), QString::number(m_countdown.seconds()), wording(u"שניות", u"seconds")};
+    case SendingSign::Percent:
+        return {sign, m_shown.percent / 100.0, QStringLiteral("%1%").arg(m_shown.percent), wording(u"נשלחו", u"sent")};
+    case SendingSign::Asking: // behind a pass the ring stays full
+        return {sign, m_phase == SendingPhase::Checking ? 1.0 : 0.0, QStringLiteral("…"),
+                wording(u"בודקים", u"checking")};
+    default:
+        return {sign, 1, {}, {}};
+    }
+}
+
+void SendingPage::tellReason(LineStep step, const Failure& failure, const QString& subject) {
+    m_shown.Label4Reason.text = LineTroubleText(m_state, step, failure, subject);
+    m_shown.Label4Reason.hint = failure.message;
+    m_shown.Label4Reason.visible = true;
+    Q_EMIT changed();
+}
+
+void SendingPage::forgetReason() {
+    m_shown.Label4Reason.text.clear();
+    m_shown.Label4Reason.visible = false;
+}
+
+// An order that has not gone stays in its folder and is found among the finished ones.
+void SendingPage::leaveForNewOrder() {
+    m_chain.follow(id(), Outcome::NewOrderWanted);
+}
+
+void SendingPage::leaveProgram() {
+    leave();
+    m_chain.endProgram();
+}
+
+} // namespace lumora

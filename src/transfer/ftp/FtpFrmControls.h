@@ -1,0 +1,126 @@
+#pragma once
+
+#include "transfer/delivery/SendingPage.h"
+
+#include <QStringList>
+
+namespace lumora {
+
+// What the page that sends by FTP shows.
+struct FtpFrmControls : SendingControls {
+    enum class PageSize {
+        Full,
+        Small, // while files travel the page is a narrow strip, so that the customer's screen is free
+    };
+    PageSize pageSize = PageSize::Full;
+    std::int16_t AllDone = 0; // 1 after success; read by the close button
+
+    // Label3 is the status line in the system's own words; Label4Do says the same to a person who never saw this page.
+    Caption Label3{*this, u"Label3"};
+    Caption Label46{*this, u"Label46"};                                // name of the order folder
+    Caption Label7{*this, u"Label7"};                                  // number of files found in the folder
+    Caption Label21{*this, u"Label21"};                                // pictures in all, copies counted
+    Caption Label4Counts{*this, u"Label4Counts"};                      // both in a sentence
+    Caption Label4Prints{*this, u"Label4Prints"};                      // the pictures in a sentence
+    Caption Label15{*this, u"Label15", Caption::At::Hidden};           // home delivery note
+    Caption Label4Ktovet{*this, u"Label4Ktovet", Caption::At::Hidden}; // the delivery address
+    Caption Label4Summary{*this, u"Label4Summary"};                    // head of the summary
+    Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary: shown at success and kept
+    QStringList Picture2Lines;                                         // as a small picture
+    Caption Picture13{*this, u"Picture13", Caption::At::Hidden};       // the proof picture
+    QString Picture13File;                                             // drive path
+
+    // The countdown's seconds stand at both places. Image10 and Image11 blink against each other meanwhile.
+    Caption Label33{*this, u"Label33"};
+    Caption Label20{*this, u"Label20"};
+    Caption Image10{*this, u"Image10"};
+    Caption Image11{*this, u"Image11", Caption::At::Hidden};
+
+    // Progress over the files of the pass.
+    static constexpr int Pic4ProgWidth = 1000;
+    Caption LabelProg{*this, u"LabelProg"}; // "42  %"
+    Caption Pic4Prog{*this, u"Pic4Prog", Caption::At::Hidden};
+    int PicInProgWidth = 0; // 0 to Pic4ProgWidth
+    Caption PicInProgKatan{*this, u"PicInProgKatan", Caption::At::Hidden};
+    int PicInProgKatanWidth = 0;                                             // pieces sent, 0 to Pic4ProgWidth
+    Caption Label4Diff{*this, u"Label4Diff", Caption::At::Hidden};           // estimated minutes left
+    Caption Label4DiffTitle{*this, u"Label4DiffTitle", Caption::At::Hidden}; // what they are
+    Caption Label4Minutes{*this, u"Label4Minutes", Caption::At::Hidden};     // their unit
+    Caption Picture1{*this, u"Picture1", Caption::At::Hidden};               // the bar that runs in each pause
+    int Picture1Width = 0;                                                   // 0 to 266
+    Caption Label34{*this, u"Label34"};                                      // which attempt
+    Caption Label4siem{*this, u"Label4siem"};                                // position in a chain of orders
+
+    // The panel "not all arrived"; Picture6 says its five parts in one sentence.
+    Caption Picture6{*this, u"Picture6", Caption::At::Hidden};
+    Caption Label4Nichshal{*this, u"Label4Nichshal"};      // "the computer failed to upload "
+    Caption Label31{*this, u"Label31"};                    // the count of a list that nothing fills
+    Caption Label4Missing{*this, u"Label4Missing"};        // the true number of missing files
+    Caption Label4Mitoch{*this, u"Label4Mitoch"};          // "files out of "
+    Caption Label12{*this, u"Label12"};                    // files meant for sending
+    Caption Label4Yooadoo{*this, u"Label4Yooadoo"};        // " files meant for sending "
+    Caption Label4Hamtana{*this, u"Label4Hamtana"};        // what to do next
+    Caption Label2{*this, u"Label2", Caption::At::Hidden}; // what went wrong
+    Caption Label9{*this, u"Label9", Caption::At::Hidden}; // where the order is kept
+    Caption Image6{*this, u"Image6", Caption::At::Hidden}; // sign of the panel
+    Caption Frame9{*this, u"Frame9", Caption::At::Hidden}; // older bulk path: which round failed
+    Caption Label4{*this, u"Label4"};                      // its round number
+
+    // "Close although nothing was sent?"
+    Caption Picture7{*this, u"Picture7", Caption::At::Hidden}; // its text
+    Caption Command14{*this, u"Command14"};                    // do not close
+    Caption Command16{*this, u"Command16"};                    // close all the same
+
+    // Buttons.
+    Caption Command12{*this, u"Command12"};                      // send
+    Caption Command10{*this, u"Command10", Caption::At::Hidden}; // send again
+    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // stop
+    Caption Command21{*this, u"Command21", Caption::At::Greyed}; // stop
+    Caption Command23{*this, u"Command23"};                      // stop the countdown, go on
+    Caption Command18{*this, u"Command18"};                      // stop the countdown
+    Caption Command11{*this, u"Command11", Caption::At::Greyed}; // exit, once all has arrived
+    Caption Command8{*this, u"Command8"};                        // exit
+    Caption Command22{*this, u"Command22"};                      // "press here in case of a communication fault"
+    Caption Command24{*this, u"Command24"};                      // show Frame2
+    Caption Command9{*this, u"Command9"};                        // hide Frame2
+    Caption Image4{*this, u"Image4"};                            // copy the order number and open the folder
+    Caption Image5{*this, u"Image5"};                            // send now
+    Caption Frame5{*this, u"Frame5"};
+    Caption Label6{*this, u"Label6"};
+    Caption Label8{*this, u"Label8"};
+    Caption Pic4Quik{*this, u"Pic4Quik", Caption::At::Hidden}; // nothing shows it
+
+    // The lab's own area: the lists and the manual panel.
+    Caption Frame2{*this, u"Frame2", Caption::At::Hidden};
+    Caption Label4ToSend{*this, u"Label4ToSend"}; // heads of List3, List6, List7 and LogList
+    Caption Label4OnServer{*this, u"Label4OnServer"};
+    Caption Label4Failed{*this, u"Label4Failed"};
+    Caption Label4Log{*this, u"Label4Log"};
+    Caption Command13{*this, u"Command13"}; // new order
+    Caption Command1{*this, u"Command1"};   // resend
+    Caption Command2{*this, u"Command2"};   // older bulk path
+    Caption Command4{*this, u"Command4"};
+    Caption Command3{*this, u"Command3"};   // put
+    Caption Command5{*this, u"Command5"};   // get
+    Caption Command6{*this, u"Command6"};   // del
+    Caption Command7{*this, u"Command7"};   // make dir
+    Caption Command17{*this, u"Command17"}; // one order of the chain
+    Caption Command19{*this, u"Command19"}; // all orders of the chain
+    Caption Command25{*this, u"Command25"}; // check one order of the chain
+    Caption Command27{*this, u"Command27"}; // copy
+    Caption File1Enabled;
+    int File1Index = -1;                // chosen entry of File1
+    Caption Label5{*this, u"Label5"};   // remote directory asked for
+    Caption Label37{*this, u"Label37"}; // remote directory at the first level, as the server tells it
+    Caption Label38{*this, u"Label38"}; // and without its slash
+    Caption Label40{*this, u"Label40"}; // the same at the second level
+    Caption Label41{*this, u"Label41"};
+    CheckCaption chkPassive{*this, u"chkPassive"};
+    CheckCaption optBin{*this, u"optBin"};
+    CheckCaption optAscii{*this, u"optAscii"};
+    Caption cmdClosehOpen{*this, u"cmdClosehOpen"};
+    Caption cmdInternetOpen{*this, u"cmdInternetOpen"};
+    Caption txtProxy{*this, u"txtProxy"};
+};
+
+} // namespace lumora

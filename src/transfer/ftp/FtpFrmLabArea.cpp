@@ -1,0 +1,104 @@
+// The lab's own area of the sending page: the older bulk path and the chain of orders.
+#include "common/DrivePathText.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "transfer/delivery/OrderFiles.h"
+#include "transfer/ftp/FtpFrm.h"
+
+namespace lumora {
+
+void FtpFrm::refillAndSendInRounds() {
+    if (isUnderWay(phase()) || AllDone == 1)
+        return;
+    // The proof picture alone would arrive and count as the whole order.
+    if (m_handedOver.isEmpty()) {
+        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        return;
+    }
+    m_sender.lists.List3.clear();
+    m_sender.lists.List3.append(BulkFiles(m_handedOver, inPieces()));
+    addProofPicture();
+    m_sender.NumToSend = m_sender.countList3();
+    showSecondsAfterFailure();
+    sendInRounds();
+}
+
+void FtpFrm::sendInRounds() {
+    if (isUnderWay(phase()) || AllDone == 1 || m_sender.stop.left)
+        return;
+    if (lists().List3.isEmpty()) {
+        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        return;
+    }
+    if (const auto end = m_sender.runOlderRounds())
+        finish(*end);
+}
+
+void FtpFrm::sendChosenOrder() {
+    if (isUnderWay(phase()) || lists().ListRezefFiles.currentIndex() < 0)
+        return;
+    SendChainOrder(lists().ListRezefFiles.currentItem());
+}
+
+void FtpFrm::sendChain() {
+    if (isUnderWay(phase()))
+        return;
+    TextList& chain = m_sender.lists.ListRezefFiles;
+    for (int i = 0; i < chain.count() && !m_sender.stop.left; ++i) {
+        chain.setCurrentIndex(i);
+        Label4siem.text = QStringLiteral("%1 / %2").arg(i + 1).arg(chain.count());
+        SendChainOrder(chain.item(i));
+        if (m_sender.pass.UserStopped == 1) {
+            status(wording(u"הרצף נעצר לפי בקשה של המשתמש ", u"The sequence stopped at the user's request "));
+            return;
+        }
+    }
+    if (!m_sender.stop.left)
+        status(wording(u"  סיים  ", u"  Finished  "));
+}
+
+void FtpFrm::SendChainOrder(const QString& name) {
+    enter(SendingPhase::Checking);
+    const QString folder = JoinDrivePath(WorkspacePaths::orders(m_state), name);
+    std::optional<SendingPhase> end = SendingPhase::NoOrder;
+    m_sender.pass.UserStopped = 0;
+    if (m_platform.files.folderExists(folder)) {
+        m_state.transfer.OrderFolder = folder;
+        listFolder();
+        countPictures();
+        m_sender.beginOrder();
+        m_state.transfer.ShemTikiya = name;
+        AllDone = 0;
+        m_sender.check.ListServerFiles();
+        m_sender.check.DropAlreadySent();
+        end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
+        if (end == SendingPhase::NotAll)
+            showFailure();
+    }
+    if (end && !m_sender.stop.left)
+        finish(*end);
+}
+
+void FtpFrm::sendChainAfterFault() {
+    if (isUnderWay(phase()))
+        return;
+    Command22.visible = false;
+    m_sender.pass.FaultPressed = true;
+    sendChain();
+    Command22.visible = true;
+    Q_EMIT changed();
+}
+
+void FtpFrm::checkChosenOrder() {
+    if (isUnderWay(phase()) || lists().ListRezefFiles.currentIndex() < 0)
+        return;
+    const SendingPhase before = phase();
+    m_state.transfer.ShemTikiya = lists().ListRezefFiles.currentItem();
+    enter(SendingPhase::Checking);
+    m_sender.check.ListServerFiles();
+    enter(before);
+}
+
+} // namespace lumora

@@ -1,0 +1,259 @@
+// All wordings of the page that sends by FTP but those of its status line, which stand beside its events.
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "session/SessionState.h"
+#include "transfer/ftp/FtpFrm.h"
+
+#include <algorithm>
+#include <array>
+
+namespace lumora {
+
+namespace {
+
+using enum SendingButton;
+
+constexpr SendingWords sendingTitle{u"שליחת ההזמנה", u"Sending your order"};
+constexpr SendingWords nothingTitle{u"אין מה לשלוח", u"Nothing can be sent"};
+constexpr SendingWords notCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
+
+constexpr std::array looks{
+    PhaseLook{SendingPhase::Preparing,
+              SendingSign::Seconds,
+              SendNow,
+              {SendNow, Hold},
+              sendingTitle,
+              {u"קוראים את ההזמנה. נא להמתין.", u"Reading the order. Please wait."}},
+    PhaseLook{SendingPhase::NoOrder,
+              SendingSign::Bad,
+              NewOrder,
+              {NewOrder},
+              nothingTitle,
+              {u"אין כאן הזמנה לשליחה.", u"There is no order to send here."}},
+    PhaseLook{SendingPhase::NoServer,
+              SendingSign::Bad,
+              NewOrder,
+              {NewOrder},
+              nothingTitle,
+              {u"לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות.",
+               u"No server is set for orders. The order is kept on this computer. Please tell the shop."}},
+    PhaseLook{SendingPhase::Countdown,
+              SendingSign::Seconds,
+              SendNow,
+              {SendNow, Hold},
+              {u"ההזמנה מוכנה לשליחה", u"Your order is ready to be sent"},
+              {u"ההזמנה מוכנה. השליחה תתחיל מעצמה בתום הספירה.",
+               u"The order is ready. Sending begins by itself when the count ends."}},
+    PhaseLook{
+        SendingPhase::Waiting,
+        SendingSign::Seconds,
+        SendNow,
+        {SendNow, Hold},
+        sendingTitle,
+        {u"הספירה נעצרה. כדי לשלוח יש ללחוץ על הלחצן שלח עכשיו.", u"The count is stopped. Press Send now to send."}},
+    PhaseLook{SendingPhase::Sending,
+              SendingSign::Percent,
+              None,
+              {Stop},
+              sendingTitle,
+              {u"ההזמנה נשלחת. נא לא לסגור את התוכנה.", u"The order is being sent. Please do not close the program."}},
+    PhaseLook{SendingPhase::Checking,
+              SendingSign::Percent,
+              None,
+              {Stop},
+              sendingTitle,
+              {u"בודקים אילו קבצים הגיעו לשרת. נא להמתין.", u"Checking which files have arrived. Please wait."}},
+    PhaseLook{SendingPhase::Reporting,
+              SendingSign::Percent,
+              None,
+              {Stop},
+              sendingTitle,
+              {u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
+               u"The whole order has arrived. Telling the shop, please wait."}},
+    PhaseLook{SendingPhase::Success,
+              SendingSign::Good,
+              NewOrder,
+              {NewOrder, Close},
+              {u"ההזמנה נשלחה", u"Your order was sent"},
+              {u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
+               u"The whole order has arrived. You can close, or begin a new order."}},
+    // %1: files on the server, %2: files of the order; in the next row too.
+    PhaseLook{SendingPhase::AllThere,
+              SendingSign::Good,
+              NewOrder,
+              {NewOrder, Close},
+              {u"ההזמנה נמצאת בשרת", u"Your order is on the server"},
+              {u"כל %2 הקבצים של משלוח זה נמצאים בשרת, ובתיקייה שם %1 קבצים. אין צורך לשלוח שוב. יש להודיע על כך "
+               u"לחנות.",
+               u"All %2 files of this sending are on the server, whose folder holds %1. There is no need to send "
+               u"again. Please tell the shop."}},
+    PhaseLook{SendingPhase::Unclear,
+              SendingSign::Unclear,
+              SendAgain,
+              {SendAgain, NewOrder},
+              {u"לא ברור אם כל ההזמנה הגיעה", u"It is not clear whether all has arrived"},
+              {u"הגיעו %1 מתוך %2 קבצים. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח שוב. אם זה חוזר, יש להודיע "
+               u"לחנות.",
+               u"%1 of %2 files have arrived. Press Send again to check and send once more. If this comes again, "
+               u"please tell the shop."}},
+    PhaseLook{SendingPhase::NotAll,
+              SendingSign::Bad,
+              SendAgain,
+              {SendAgain, NewOrder},
+              notCompleteTitle,
+              {u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן שלח שוב.", u"Wait 30 seconds, then press Send again."}},
+    PhaseLook{
+        SendingPhase::Stopped,
+        SendingSign::Bad,
+        SendAgain,
+        {SendAgain, NewOrder},
+        notCompleteTitle,
+        {u"השליחה נעצרה. כדי להמשיך יש ללחוץ על הלחצן שלח שוב.", u"Sending was stopped. Press Send again to go on."}},
+};
+
+constexpr std::array attemptTitles{
+    SendingWords{u"", u""},
+    SendingWords{u"נסיון שני לקבצים שלא עלו", u"Second attempt for the files that did not go up"},
+    SendingWords{u"נסיון שלישי לקבצים שלא עלו", u"Third attempt for the files that did not go up"},
+    SendingWords{u"נסיון רביעי ואחרון להעלות קבצים שלא עלו",
+                 u"Fourth and last attempt to upload the files that did not go up"},
+};
+
+} // namespace
+
+const PhaseLook& FtpFrm::lookOf(SendingPhase phase) const {
+    return *std::find_if(looks.begin(), looks.end(), [&](const PhaseLook& row) { return row.phase == phase; });
+}
+
+QString FtpFrm::advice(const PhaseLook& row) const {
+    const QString text = wording(row.advice);
+    return text.contains(u'%') ? text.arg(m_sender.check.NumOnServer).arg(m_sender.NumToSend) : text;
+}
+
+void FtpFrm::showPhase(const PhaseLook& row) {
+    const bool underWay = isUnderWay(row.phase);
+    const bool ended = row.main == SendAgain;
+    Command15.enabled = Command21.enabled = underWay && row.phase != SendingPhase::Reporting;
+    Command15.visible = row.buttons.testFlag(Stop);
+    Image5.visible = row.buttons.testFlag(SendNow);
+    Command23.visible = row.buttons.testFlag(Hold);
+    // The order stays in its folder, so that what is missing can be sent.
+    Command10.visible = row.buttons.testFlag(SendAgain);
+    Command11.visible = Command11.enabled = row.buttons.testFlag(Close);
+    Command23.text =
+        row.phase == SendingPhase::Waiting ? wording(u"המשך", u"Go on") : wording(u"עצור משלוח", u"Stop sending");
+    PicInProgKatan.visible = underWay && inPieces();
+    Pic4Failure.visible = ended && (Picture6.visible || Label4Reason.visible);
+    showMinutes();
+}
+
+// The minutes are known from the second piece on.
+void FtpFrm::showMinutes() {
+    Label4Diff.visible = Label4DiffTitle.visible = Label4Minutes.visible =
+        isUnderWay(phase()) && inPieces() && !Label4Diff.text.isEmpty();
+}
+
+void FtpFrm::setTexts() {
+    setButtonTexts();
+    setPanelTexts();
+    showCounts();
+    tellPhase();
+    Q_EMIT changed();
+}
+
+void FtpFrm::setButtonTexts() {
+    const auto set = [this](Caption& control, const char16_t* hebrew, const char16_t* english) {
+        control.text = wording(hebrew, english);
+    };
+    set(Command12, u"שלח ", u"Send ");
+    set(Command10, u"שלח שוב", u"Send again");
+    set(Command28, u"הזמנה חדשה", u"New order");
+    set(Command15, u"עצור", u"Stop");
+    set(Command21, u"Stop", u"Stop");
+    set(Command18, u"עצור ספירה", u"Stop the count");
+    set(Command11, u"יציאה", u"Exit");
+    set(Command8, u"יציאה", u"Exit");
+    set(Command14, u"לא לסגור", u"Do not close");
+    set(Command16, u"סגור את התוכנה למרות שלא נשלחו התמונות", u"Close the program although the pictures were not sent");
+    set(Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here");
+    set(Command24, u"הצג יותר פרטים", u"Show more details");
+    set(Command9, u"הסתר פרטים", u"Hide details");
+    set(Image3, u"סגור", u"Close");
+    set(Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder");
+    set(Image5, u"שלח עכשיו", u"Send now");
+    set(Command13, u"לפני שליחה", u"Before sending");
+    set(Command1, u"משלוח חוזר", u"Resend");
+    set(Command2, u"מילוי ושליחה", u"Refill and send");
+    set(Command4, u"שליחה בסבבים", u"Send in rounds");
+    const std::pair<Caption*, const char16_t*> sameInBoth[] = {{&Command3, u"put"},
+                                                               {&Command5, u"get"},
+                                                               {&Command6, u"del"},
+                                                               {&Command7, u"make dir"},
+                                                               {&Command17, u"SendOneOrder"},
+                                                               {&Command19, u"All Orders"},
+                                                               {&Command25, u"BdikaAfterUploadB"},
+                                                               {&Command27, u"Copy"}};
+    for (const auto& [control, text] : sameInBoth)
+        control->text = QString::fromUtf16(text);
+    txtProxy.hint = QStringLiteral("TIS Compatible Proxy (No CERN):");
+}
+
+void FtpFrm::setPanelTexts() {
+    const auto set = [this](Caption& control, const char16_t* hebrew, const char16_t* english) {
+        control.text = wording(hebrew, english);
+    };
+    set(Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
+        u"We have noted that you asked to get the printed pictures by delivery to your home");
+    set(Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload ");
+    set(Label4Mitoch, u"קבצים מתוך ", u"files out of ");
+    set(Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending ");
+    set(Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
+        u"It is advised to wait 30 seconds and then press Send again");
+    set(Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
+        u"The order is kept on this computer, and files that have arrived are not sent again.");
+    set(Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending");
+    set(Label4Minutes, u"דקות", u"minutes");
+    set(PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order");
+    set(Label4Summary, u"סיכום ההזמנה", u"Summary of your order");
+    set(Label4ToSend, u"קבצים לשליחה", u"Files to be sent");
+    set(Label4OnServer, u"נמצאים בשרת", u"On the server");
+    set(Label4Failed, u"שליחה שנכשלה", u"Failed");
+    set(Label4Log, u"יומן", u"Log");
+    set(Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
+        u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all pictures "
+        u"will be printed.");
+}
+
+void FtpFrm::showCounts() {
+    const QString prints = Label21.text.trimmed();
+    Label4Counts.visible = Label4Prints.visible = !prints.isEmpty();
+    Label4Counts.text = wording(u"%1 תמונות, %2 קבצים", u"%1 prints, %2 files").arg(prints, Label7.text.trimmed());
+    Label4Prints.text = wording(u"תמונות בהזמנה: %1", u"Prints in this order: %1").arg(prints);
+}
+
+void FtpFrm::showAttempt(int attempt) {
+    Label34.text = wording(attemptTitles.at(static_cast<std::size_t>(attempt - 1)));
+    Label34.visible = true;
+}
+
+void FtpFrm::showStoppedBoxes() {
+    Dialogs& dialogs = m_platform.dialogs;
+    dialogs.message(wording(u" התהליך הופסק ביוזמת המשתמש ", u" The process was stopped by the user "));
+    dialogs.message(wording(u"אם תרצה להמשיך המשלוח לחץ על לחצן שלח דרך האינטרנט\r"
+                            u"אם אינך מתכוון להמשיך במשלוח הנך מתבקש להודיע על כך לחנות תודה",
+                            u"To go on, press the button that sends through the internet.\r"
+                            u"If you do not mean to go on, please tell the shop. Thank you."));
+}
+
+void FtpFrm::showNoServerBoxes() {
+    Dialogs& dialogs = m_platform.dialogs;
+    dialogs.message(wording(u"המחשב לא מצא שרת זמין\rנסה במועד מאוחר יותר",
+                            u"The computer found no available server.\rTry at a later time."));
+    dialogs.message(
+        wording(u"אין צורך לבצע את הבחירה מהתחלה\rפשוט יש להפעיל את התוכנה מהתחלה\rולבחור מהאפשרויות "
+                u"\r  ש ל י ח ה    ח ו ז ר ת  ",
+                u"There is no need to choose again.\rJust start the program\rand pick from the options\r  R E S E N "
+                u"D  "));
+}
+
+} // namespace lumora

@@ -1,0 +1,164 @@
+// Events and routines of the sending page that no control of the program calls: the lab's manual panel, the resend from
+// the page's own file list, and the question behind a fatal error. They stay for the lab's own tests.
+#include "common/DrivePathText.h"
+#include "order/OrderNames.h"
+#include "order/PieceName.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "session/SessionState.h"
+#include "transfer/ftp/FtpFrm.h"
+
+namespace lumora {
+
+void FtpFrm::Command27_Click() {
+    const auto made = m_platform.files.makeFolder(m_state.DiskRoot + QStringLiteral("!!AVROO"));
+    if (!made)
+        m_platform.dialogs.message(made.failure().message);
+    m_sender.lists.List4Tikiyot.setCurrentIndex(0);
+    Q_EMIT changed();
+}
+
+bool FtpFrm::inSession(const QString& message) {
+    if (!isUnderWay(phase()) && m_sender.session.bActiveSession)
+        return true;
+    m_platform.dialogs.message(message);
+    return false;
+}
+
+QString FtpFrm::chosenRemoteName() {
+    if (!inSession(QStringLiteral("Not in session")))
+        return {};
+    const QString chosen = lists().List2.currentItem();
+    if (chosen.isEmpty())
+        m_platform.dialogs.message(QStringLiteral("Please select the item to GET!"));
+    return chosen.mid(chosen.lastIndexOf(u'/') + 1);
+}
+
+void FtpFrm::Command3_Click() {
+    if (!inSession(QStringLiteral("Not in session")))
+        return;
+    if (File1.name(File1Index).isEmpty()) {
+        m_platform.dialogs.message(QStringLiteral("Please select a local file to put"));
+        return;
+    }
+    m_sender.session.putHere(JoinDrivePath(File1.folder(), File1.name(File1Index)));
+    Q_EMIT changed();
+}
+
+void FtpFrm::Command5_Click() {
+    const QString name = chosenRemoteName();
+    if (!name.isEmpty())
+        m_sender.session.getHere(name, File1.folder());
+    Q_EMIT changed();
+}
+
+void FtpFrm::Command6_Click() {
+    const QString name = chosenRemoteName();
+    if (!name.isEmpty())
+        m_sender.session.removeHere(name);
+    Q_EMIT changed();
+}
+
+void FtpFrm::Command7_Click() {
+    if (inSession(QStringLiteral("Not in session")))
+        m_sender.session.makeGoop();
+    Q_EMIT changed();
+}
+
+void FtpFrm::cmdInternetOpen_Click() {
+    if (isUnderWay(phase()))
+        return;
+    m_sender.session.FtpOpenInternet();
+    m_sender.session.FtpConnectServer();
+    Q_EMIT changed();
+}
+
+void FtpFrm::cmdClosehOpen_Click() {
+    if (isUnderWay(phase()))
+        return;
+    m_sender.session.closeSession();
+    Q_EMIT changed();
+}
+
+// Both options store the same transfer type: the lab's server takes every file, pictures too, as ASCII with its bytes
+// unchanged.
+void FtpFrm::optBin_Click() {
+    m_sender.session.dwType = 1;
+    optBin.checked = true;
+    optAscii.checked = false;
+    Q_EMIT changed();
+}
+
+void FtpFrm::optAscii_Click() {
+    m_sender.session.dwType = 1;
+    optAscii.checked = true;
+    optBin.checked = false;
+    Q_EMIT changed();
+}
+
+void FtpFrm::chkPassive_Click(bool checked) {
+    m_sender.session.passive = chkPassive.checked = checked;
+    Q_EMIT changed();
+}
+
+void FtpFrm::File1_Click(int index) {
+    File1Index = index;
+    Q_EMIT changed();
+}
+
+void FtpFrm::List2_Click(int index) {
+    m_sender.lists.List2.setCurrentIndex(index);
+    Q_EMIT changed();
+}
+
+void FtpFrm::ListRezefFiles_Click(int index) {
+    m_sender.lists.ListRezefFiles.setCurrentIndex(index);
+    Q_EMIT changed();
+}
+
+void FtpFrm::takeChain(const QStringList& folderNames) {
+    m_sender.lists.ListRezefFiles.clear();
+    m_sender.lists.ListRezefFiles.append(folderNames);
+}
+
+void FtpFrm::PrepareResendHere(const QString& folder) {
+    const bool pieces = TravelsInPieces(folder);
+    File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
+    if (pieces) {
+        m_state.transfer.Mefurak = Travel::Pieces;
+        m_state.transfer.HazmanaP = 1;
+    }
+    m_state.transfer.OrderFolder = folder;
+    File1.setFolder(folder);
+    File1.refresh();
+    clearLists();
+    TextList& list = m_sender.lists.List3;
+    const QString log = OrderTextPath(folder);
+    if (m_platform.files.fileExists(log))
+        list.append(log);
+    for (const QString& entry : File1.names()) {
+        const QString path = JoinDrivePath(folder, entry);
+        if ((!inPieces() || IsPiece(entry) || IsSheet(entry)) && path != log)
+            list.append(path);
+    }
+    if (list.isEmpty()) {
+        m_platform.dialogs.message(wording(u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני",
+                                           u"You chose no files to send from the yellow window.\r"
+                                           u"Read the instructions of step two."));
+        return;
+    }
+    m_state.transfer.SugMishloah = Sending::Chain;
+    armCountdown();
+}
+
+void FtpFrm::FtpFatalErrorAsk(const Failure& failure, const QString& source) {
+    FtpSession& session = m_sender.session;
+    session.takeResponse(failure);
+    const QString text = source + QStringLiteral(" Err: ") + QString::number(LineErrorNumber(failure.kind)) +
+                         QStringLiteral(" Extd Err: ") + session.LastResponse +
+                         QStringLiteral("\r\nClose Connection and Session?");
+    if (m_platform.dialogs.ask(text))
+        session.closeSession();
+}
+
+} // namespace lumora

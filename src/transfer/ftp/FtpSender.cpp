@@ -1,0 +1,160 @@
+#include "transfer/ftp/FtpSender.h"
+
+#include "common/FixedText.h"
+#include "platform/Platform.h"
+
+namespace lumora {
+
+class FtpSender::FourAttempts final : public Attempts {
+public:
+    FourAttempts(FtpSender& sender, SendingEvents& events)
+        : Attempts(events, sender.stop)
+        , m_sender(sender) {}
+
+private:
+    bool sendMissing(int) override {
+        m_sender.pass.run();
+        return m_sender.pass.UserStopped == 0;
+    }
+
+    std::optional<SendingPhase> checkArrival(int attempt) override {
+        FtpLists& lists = m_sender.lists;
+        UploadCheck& check = m_sender.check;
+        m_sender.session.PauseBar();
+        if (attempt == 1) {
+            if (lists.List3.count() < lists.List4Makor.count())
+                m_sender.refill();
+            if (lists.List3.isEmpty()) {
+                m_events.reached(SendingMoment::NothingToSend);
+                return SendingPhase::NoOrder;
+            }
+        }
+        compare(attempt);
+        const bool arrived = m_sender.allCounted();
+        // A stop cuts the check short; what it still saw itself counts.
+        if (m_stop.StopFlag && !(arrived && check.freshCount)) {
+            if (!m_stop.left)
+                m_sender.pass.endStopped();
+            return SendingPhase::Stopped;
+        }
+        if (arrived)
+            return SendingPhase::Success;
+        if (check.NumOnServer > m_sender.NumToSend)
+            return std::nullopt;
+        if (lists.List3.isEmpty())
+            return m_sender.silentEnd();
+        m_events.reached(SendingMoment::Incomplete, static_cast<int>(check.missing().size()));
+        return std::nullopt;
+    }
+
+    // Afterwards List3 holds what is missing, unless the server holds too many names.
+    void compare(int attempt) {
+        UploadCheck& check = m_sender.check;
+        check.check(attempt);
+        if (check.NumOnServer >= m_sender.NumToSend || m_stop.left)
+            return;
+        // A second look, since the first may have failed and counted an older listing.
+        check.ListServerFiles();
+        if (check.NumOnServer < m_sender.NumToSend)
+            check.RebuildMissing();
+    }
+
+    SendingPhase afterTheLast() override {
+        return m_sender.check.NumOnServer > m_sender.NumToSend ? m_sender.silentEnd() : SendingPhase::NotAll;
+    }
+
+    FtpSender& m_sender;
+};
+
+class FtpSender::OlderRounds final : public Attempts {
+public:
+    OlderRounds(FtpSender& sender, SendingEvents& events)
+        : Attempts(events, sender.stop)
+        , m_sender(sender) {}
+
+private:
+    static constexpr int mostConnectFails = 5;
+
+    bool sendMissing(int) override {
+        m_stop.StopFlag = false;
+        const FtpSession& session = m_sender.session;
+        for (int i = 0; i < m_sender.lists.List3.count() && session.ConnectFails <= mostConnectFails; ++i) {
+            if (m_stop.StopFlag || m_stop.left)
+                break;
+            m_sender.pass.UploadOneFile(i);
+        }
+        return !stopped();
+    }
+
+    std::optional<SendingPhase> checkArrival(int round) override {
+        UploadCheck& check = m_sender.check;
+        check.ListServerFiles();
+        if (m_sender.allCounted() && (check.freshCount || !m_stop.StopFlag))
+            return SendingPhase::Success;
+        if (stopped())
+            return SendingPhase::Stopped;
+        if (check.NumOnServer < m_sender.NumToSend) {
+            m_sender.session.RoundNo = HoldIn16Bits(round);
+            m_events.reached(SendingMoment::RoundFailed, round);
+            m_anyFailed = true;
+        }
+        return std::nullopt;
+    }
+
+    SendingPhase afterTheLast() override { return m_anyFailed ? SendingPhase::NotAll : m_sender.silentEnd(); }
+
+    bool stopped() {
+        if (m_stop.StopFlag && !m_stop.left)
+            m_sender.pass.endStopped();
+        return m_sender.pass.UserStopped == 1;
+    }
+
+    FtpSender& m_sender;
+    bool m_anyFailed = false;
+};
+
+FtpSender::FtpSender(const ClientProfile& profile, TransferState& transfer, const Platform& platform,
+                     SendingEvents& events)
+    : session(profile, transfer, platform, events, stop, lists)
+    , pass(transfer, platform, events, stop, lists, session)
+    , check(transfer, platform.pump, events, stop, lists, session)
+    , m_events(events) {}
+
+void FtpSender::clearLists() {
+    for (TextList* list : {&lists.List3, &lists.List4Makor, &lists.List4Broken, &lists.List6, &lists.List7})
+        list->clear();
+    NumToSend = 0;
+    check.NumOnServer = 0;
+}
+
+void FtpSender::beginOrder() {
+    NumToSend = countList3();
+    lists.List4Makor.clear();
+    lists.List4Makor.append(lists.List3.items());
+}
+
+std::int16_t FtpSender::countList3() const {
+    return HoldIn16Bits(lists.List3.count());
+}
+
+void FtpSender::refill() {
+    lists.List3.clear();
+    lists.List3.append(lists.List4Makor.items());
+}
+
+std::optional<SendingPhase> FtpSender::RunAttempts() {
+    pass.UserStopped = 0;
+    return FourAttempts(*this, m_events).run(attempts);
+}
+
+std::optional<SendingPhase> FtpSender::runOlderRounds() {
+    session.beginPass();
+    pass.UserStopped = 0;
+    return OlderRounds(*this, m_events).run(olderRounds, SendingMoment::RoundBegins);
+}
+
+SendingPhase FtpSender::silentEnd() const {
+    return check.missing().isEmpty() && check.NumOnServer >= NumToSend ? SendingPhase::AllThere : SendingPhase::Unclear;
+}
+
+} // namespace lumora

@@ -1,0 +1,245 @@
+#include "transfer/http/HttpSender.h"
+
+#include "common/AnsiCodePage.h"
+#include "common/DrivePathText.h"
+#include "order/OrderReport.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+#include "transfer/delivery/OrderFiles.h"
+#include "transfer/report/InetForm.h"
+
+namespace lumora {
+
+namespace {
+
+constexpr int pauseRounds = 1801;
+// A list is some lines of names; what is larger is none.
+constexpr qint64 largestList = 4 * 1024 * 1024;
+const QString testFolder = QStringLiteral("tttt");
+
+} // namespace
+
+HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEvents& events)
+    : Attempts(events, stop)
+    , m_state(state)
+    , m_platform(platform)
+    , m_script(platform) {}
+
+QString HttpSender::folderName() const {
+    return LeafName(m_state.transfer.OrderFolder);
+}
+
+QString HttpSender::siteAddress(const QString& rest) const {
+    return m_state.profile.HttpHost + u'/' + m_state.profile.HttpTikiya + rest;
+}
+
+void HttpSender::HttpPause(int times) {
+    for (int time = 0; time < times; ++time)
+        pauseInRounds(pauseRounds, m_events, m_platform.pump, m_stop);
+}
+
+QString HttpSender::FetchUrl(const QString& url) const {
+    const auto body = m_platform.internet.fetch(url);
+    return body ? AnsiCodePage::decode(*body) : QString();
+}
+
+void HttpSender::BuildOrderFileList() {
+    lists.List4Kvazim.clear();
+    lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
+}
+
+void HttpSender::tellMissing() {
+    m_events.reached(SendingMoment::Missing, lists.List4Hossarim.count());
+}
+
+std::optional<SendingPhase> HttpSender::HttpAttempts() {
+    // One cell serves as the number of the list file and as the count of what is missing: behind a first attempt that
+    // missed more than three files there is no list of that number, and the whole order goes again.
+    m_listNumber = 1;
+    m_listFailure = {};
+    return run(attempts);
+}
+
+bool HttpSender::sendMissing(int) {
+    const QStringList files = lists.List4Hossarim.items();
+    m_left = static_cast<int>(files.size());
+    m_allPosted = true;
+    for (int i = 0; i < files.size(); ++i) {
+        m_events.sending(i, static_cast<int>(files.size()), LeafName(files[i]));
+        HttpPause();
+        if (m_stop.left)
+            return false;
+        post(files[i]);
+        m_platform.pump.pump();
+        m_events.progressed(i, lists.List4Hossarim.count());
+        if (m_stop.left)
+            return false;
+    }
+    return true;
+}
+
+void HttpSender::post(const QString& path) {
+    const QString folder = ParentFolder(path);
+    const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php");
+    lists.TxtWeb = m_script.MultipartPost(LeafName(folder), {path}, url, folder, lists.TxtUrl, {}, {});
+    m_events.reached(SendingMoment::Answered);
+    if (m_script.failed()) {
+        m_allPosted = false;
+        m_events.failed(m_script.failedBeforeSending() ? LineStep::File : LineStep::Put, m_script.lastFailure(),
+                        LeafName(path));
+    } else {
+        m_events.reached(SendingMoment::Posted, --m_left);
+    }
+}
+
+std::optional<SendingPhase> HttpSender::checkArrival(int) {
+    findMissing(m_listNumber);
+    m_listNumber = lists.List4Hossarim.count();
+    // A file that stayed behind says more than the list that lacks it.
+    if (m_allPosted && !lists.List4Hossarim.isEmpty() && !m_stop.left)
+        m_events.failed(listTrouble(), m_listFailure);
+    m_events.reached(SendingMoment::CheckEnds);
+    if (lists.List4Hossarim.isEmpty())
+        return SendingPhase::Success;
+    return std::nullopt;
+}
+
+// Why a check found files missing although each was posted.
+LineStep HttpSender::listTrouble() const {
+    if (m_listFailure.message.isEmpty())
+        return LineStep::Confirm;
+    switch (m_listFailure.kind) {
+    case Failure::Kind::Disconnected:
+    case Failure::Kind::TimedOut:
+        return LineStep::List;
+    case Failure::Kind::NotFound:
+    case Failure::Kind::AccessDenied:
+    case Failure::Kind::NoSpace:
+    case Failure::Kind::Other:
+        return LineStep::KeepList;
+    default:
+        return LineStep::Confirm;
+    }
+}
+
+void HttpSender::findMissing(int listNumber) {
+    if (CheckOrderOnServer(listNumber) != ServerVerdict::Listed) {
+        lists.List4Hossarim.clear();
+        lists.List4Hossarim.append(lists.List4Kvazim.items());
+    }
+    tellMissing();
+}
+
+ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
+    lists.ListAfterWeb.clear();
+    lists.TxtWeb.clear();
+    QString& order = m_state.transfer.OrderFolder;
+    if (order.endsWith(u'\\'))
+        order.chop(1);
+    const QString name = folderName();
+    m_state.transfer.ShemTikiya = name;
+    m_events.reached(SendingMoment::Answered);
+    if (lists.List4Kvazim.isEmpty() || !IsOrderFolder(order) ||
+        LeafName(ParentFolder(lists.List4Kvazim.item(0))) != name)
+        return ServerVerdict::OtherFolder;
+    HttpFetchFileListN(listNumber);
+    if (m_stop.left)
+        return ServerVerdict::NotVerified;
+    readListInOrder();
+    const ServerAnswer answer = ReadServerAnswer(lists.TxtWeb, name);
+    lists.ListAfterWeb.append(answer.entries);
+    // What is named counts as arrived even in a list without a total, but such a list is not believed: the whole order
+    // goes again.
+    if (answer.namesFolder) {
+        const QStringList missing = MarkHossarim(lists.List4Kvazim.items(), lists.ListAfterWeb.items(), name);
+        lists.List4Hossarim.clear();
+        lists.List4Hossarim.append(missing);
+        tellMissing();
+    }
+    return answer.verdict;
+}
+
+void HttpSender::readListInOrder() {
+    lists.ListInOrder.clear();
+    lists.ListInOrder.append(ParseServerList(lists.TxtFromWeb));
+}
+
+void HttpSender::HttpFetchFileListN(int listNumber) {
+    const Files& files = m_platform.files;
+    if (!files.folderExists(WorkspacePaths::root(m_state)))
+        (void)files.makeFolder(WorkspacePaths::root(m_state));
+    lists.TxtWeb.clear();
+    HttpPause(2);
+    lists.TxtFromWeb.clear();
+    HttpPause(2);
+    lists.TxtWeb = FetchUrl(siteAddress(QStringLiteral("/listfileb.php?tik=") + folderName()));
+    m_events.reached(SendingMoment::Answered);
+    HttpPause(3);
+    m_platform.pump.pump();
+    HttpPause();
+    if (!m_stop.left)
+        downloadList(listNumber);
+    m_events.reached(SendingMoment::Answered);
+    HttpPause(2);
+}
+
+void HttpSender::downloadList(int listNumber) {
+    const Files& files = m_platform.files;
+    clsDownload download(m_platform);
+    // The list of an earlier check would pass for the answer of this one.
+    const QString list = JoinDrivePath(m_state.transfer.OrderFolder, ListFileName(0));
+    const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
+    if (!cleared)
+        m_listFailure = cleared.failure();
+    const QString uploads = siteAddress(QStringLiteral("/uploads/") + folderName() + u'/');
+    download.download(uploads + QStringLiteral("filelist1.txt"),
+                      JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("filelist1.txt")));
+    HttpPause(2);
+    const QString remote = ListFileName(listNumber);
+    if (cleared && !remote.isEmpty()) {
+        download.download(uploads + remote, list);
+        m_listFailure = download.lastFailure();
+    }
+    m_platform.pump.pump();
+    HttpPause(3);
+    const auto size = files.size(list);
+    if (cleared && size && *size <= largestList) {
+        if (const auto text = files.read(list))
+            lists.TxtFromWeb = lists.TxtWeb = AnsiCodePage::decode(*text);
+    }
+}
+
+void HttpSender::HttpSendReport() const {
+    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state));
+}
+
+void HttpSender::HttpSendDone() const {
+    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state));
+}
+
+void HttpSender::postTestPicture() {
+    const QString& host = m_state.profile.HttpHost;
+    const QString scheme = QStringLiteral("://");
+    const QString bare = host.contains(scheme) ? host.mid(host.indexOf(scheme) + scheme.size()) : host;
+    lists.TxtWeb = m_script.MultipartPostInet(testFolder, {QStringLiteral("4445.png")}, bare,
+                                              m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php"),
+                                              WorkspacePaths::root(m_state), lists.TxtUrl);
+}
+
+void HttpSender::postNothing() {
+    lists.TxtWeb = m_script.MultipartPost(testFolder, {},
+                                          m_state.profile.HttpHost + m_state.profile.HttpScriptPath +
+                                              QStringLiteral("uploads/listfile.php"),
+                                          {}, lists.TxtUrl, {}, {});
+}
+
+void HttpSender::fetchTestListing() {
+    lists.TxtWeb = FetchUrl(m_state.profile.HttpHost + m_state.profile.HttpScriptPath +
+                            QStringLiteral("listfile.php?tik=") + testFolder);
+}
+
+} // namespace lumora

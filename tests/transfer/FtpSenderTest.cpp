@@ -1,0 +1,305 @@
+#include "transfer/ftp/FtpSender.h"
+#include "support/FakeLab.h"
+#include "support/RecordedSending.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+namespace {
+
+using enum SendingMoment;
+
+const QString base = u"zalamim234"_s;
+const QString folder = u"C:\\order^1"_s;
+
+// The FTP sender over a lab that has the folder of the orders, with an order of three files.
+struct Line {
+    Line() {
+        lab.folders[base];
+        profile.FtpServer = u"192.0.2.10"_s;
+        profile.FtpFolder2 = base;
+        transfer.OrderFolder = folder;
+        transfer.ShemTikiya = u"order^1"_s;
+        (void)test.files.makeFolder(folder);
+        for (const QString& name : names())
+            EXPECT_TRUE(test.files.writeWhole(path(name), name.toLatin1().repeated(50)));
+        order(names());
+        sender.session.takeSettings();
+    }
+
+    static QStringList names() { return {u"log.txt"_s, u"01a.jpp"_s, u"02b.jpp"_s}; }
+    static QString path(const QString& name) { return folder + u'\\' + name; }
+    void order(const QStringList& leaves) {
+        sender.clearLists();
+        for (const QString& leaf : leaves)
+            sender.lists.List3.append(path(leaf));
+        sender.beginOrder();
+    }
+    FakeLab::Folder& remote() { return lab.folders[base + u"/order^1"_s]; }
+    void walk() {
+        sender.session.FtpOpenInternet();
+        sender.session.FtpConnectServer();
+        sender.session.EnterFolderTK1();
+        sender.session.EnterFolderTK2();
+    }
+
+    FakeLab lab;
+    TestPlatform test{lab};
+    ClientProfile profile;
+    TransferState transfer;
+    RecordedSending told;
+    FtpSender sender{profile, transfer, test.platform, told};
+};
+
+struct FtpSenderTest : ::testing::Test, Line {
+    FtpSession& session = sender.session;
+    FtpLists& lists = sender.lists;
+};
+
+} // namespace
+
+TEST_F(FtpSenderTest, TellsAfterFourRefusedOpensWithTheNumberFive) {
+    lab.deadOpens = FakeLab::always;
+    session.FtpOpenInternet();
+    session.FtpOpenInternet();
+    EXPECT_FALSE(session.hOpen);
+    EXPECT_EQ(told.number(NoInternet), 5);
+    EXPECT_EQ(told.count(NoInternet), 1) << "once a pass";
+    lab.deadOpens = 3;
+    session.FtpOpenInternet();
+    EXPECT_TRUE(session.hOpen);
+    EXPECT_EQ(told.number(Opening), 4);
+}
+
+TEST_F(FtpSenderTest, TriesToConnectFiveTimes) {
+    lab.deadConnects = 4;
+    walk();
+    EXPECT_TRUE(session.bActiveSession);
+    EXPECT_EQ(lab.connects, 5);
+    EXPECT_EQ(lab.lastChannel, Internet::DataChannel::Passive);
+    session.FtpCloseConnection();
+    session.passive = false;
+    lab.refusedLogins = FakeLab::always;
+    walk();
+    EXPECT_EQ(lab.lastChannel, Internet::DataChannel::Active);
+    EXPECT_FALSE(session.bActiveSession || session.FolderOk);
+    EXPECT_EQ(told.number(NotConnected), 5);
+    EXPECT_EQ(told.troubles.back().failure.kind, Failure::Kind::Refused);
+}
+
+TEST_F(FtpSenderTest, WalksToTheLabsFolderWithOneLevelAndWithTwo) {
+    walk();
+    EXPECT_TRUE(session.FolderOk && session.insideOrderBase());
+    EXPECT_EQ(told.folders, QStringList(u"2 /zalamim234 zalamim234"_s));
+    session.FtpCloseConnection();
+
+    lab.folders[u"first"_s];
+    lab.folders[u"first/second"_s];
+    profile.FtpFolder1 = u"first"_s;
+    profile.FtpFolder2 = u"second"_s;
+    EXPECT_FALSE(session.insideOrderBase());
+    walk();
+    EXPECT_TRUE(session.FolderOk && session.insideOrderBase());
+    EXPECT_EQ(session.MikumBaSharat, u"first/second"_s);
+
+    profile.FtpFolder2 = u"third"_s;
+    session.FtpCloseConnection();
+    walk();
+    EXPECT_FALSE(session.FolderOk);
+    EXPECT_EQ(told.count(FolderMissing), 0) << "a miss of the second level passes in silence";
+
+    profile.FtpFolder1.clear();
+    session.FtpCloseConnection();
+    walk();
+    EXPECT_EQ(session.ConnectFails, 1);
+    EXPECT_EQ(told.count(FolderMissing), 1);
+}
+
+TEST_F(FtpSenderTest, TellsAMissingSessionOnceInAPass) {
+    lists.List1.append(base);
+    session.EnterFolderTK2();
+    session.EnterFolderTK2();
+    EXPECT_EQ(told.count(NoSession), 1);
+}
+
+TEST_F(FtpSenderTest, MakesTheOrdersFolderOnceAndListsItAfterwards) {
+    lists.List6.append(u"left over"_s);
+    walk();
+    EXPECT_TRUE(session.EnterOrderFolder());
+    EXPECT_TRUE(lists.List6.isEmpty());
+    session.FtpCloseConnection();
+    walk();
+    EXPECT_TRUE(session.EnterOrderFolder());
+    EXPECT_EQ(lists.List6.items(), QStringList(QString())) << "an empty folder lists one empty name";
+    remote()[u"a.jpp"_s] = "a";
+    lab.failedListings = 1;
+    session.ListRemoteHere();
+    EXPECT_TRUE(session.colNames.isEmpty());
+    EXPECT_FALSE(session.bActiveSession || session.hOpen);
+    lab.refusesEntry = true;
+    walk();
+    EXPECT_FALSE(session.EnterOrderFolder() || session.inOrderFolder());
+}
+
+TEST_F(FtpSenderTest, NotesAFailedPutWithHourAndMinuteAsTheyAre) {
+    test.clock.time = QDateTime(QDate(2026, 11, 21), QTime(9, 5));
+    walk();
+    EXPECT_FALSE(session.FtpSendFile(u"C:\\none.jpp"_s));
+    EXPECT_FALSE(session.FtpSendFile({}));
+    EXPECT_EQ(lists.LogList.items(),
+              (QStringList{u"95fail to up loadC:\\none.jpp"_s, u"95sendfile-no-image selected"_s}));
+    EXPECT_EQ(lists.List7.items(), QStringList(u"C:\\none.jpp"_s));
+    EXPECT_EQ(lists.List7.items(), lists.List4Broken.items());
+    EXPECT_TRUE(lab.puts.isEmpty());
+}
+
+// The faults that a relay can make on a real line stand with the real server; here those of a server's own doing.
+TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
+    const struct {
+        const char* name;
+        std::function<void(Line&)> arrange;
+        SendingPhase end;
+        int attempts;
+        qsizetype puts;
+    } cases[] = {
+        {"clean", [](Line&) {}, SendingPhase::Success, 1, 3},
+        {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, SendingPhase::Success, 1, 3},
+        {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, SendingPhase::NotAll, 4, 0},
+        {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, SendingPhase::NotAll, 4, 0},
+        {"cut, and the remains can't be deleted",
+         [](Line& line) {
+             line.lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
+             line.lab.refusesDelete = true;
+         },
+         SendingPhase::Success, 2, 4},
+        {"cut in each attempt, remains stay",
+         [](Line& line) {
+             line.lab.putFaults = {{u"02b.jpp"_s, FakeLab::always, 20}};
+             line.lab.refusesDelete = true;
+         },
+         SendingPhase::NotAll, 4, 6},
+        {"the folder of a local file itself",
+         [](Line& line) {
+             line.order({u"01a.jpp"_s, QString()});
+         },
+         SendingPhase::NotAll, 4, 1},
+        {"all there, and a stranger beside it", [](Line& line) { line.remote()[u"stranger.jpp"_s] = "x"; },
+         SendingPhase::AllThere, 4, 3},
+        {"strangers and a file that never arrives",
+         [](Line& line) {
+             line.remote() = {{u"x1"_s, "x"}, {u"x2"_s, "x"}};
+             line.lab.putFaults = {{u"01a.jpp"_s, FakeLab::always, -1}};
+         },
+         SendingPhase::Unclear, 4, 6},
+        {"one name twice in the order",
+         [](Line& line) {
+             line.order({u"01a.jpp"_s, u"01a.jpp"_s, u"02b.jpp"_s});
+         },
+         SendingPhase::Unclear, 1, 2},
+        {"an empty order", [](Line& line) { line.order({}); }, SendingPhase::NoOrder, 1, 0},
+    };
+    for (const auto& each : cases) {
+        SCOPED_TRACE(each.name);
+        Line line;
+        each.arrange(line);
+        EXPECT_EQ(line.sender.RunAttempts(), each.end);
+        EXPECT_EQ(line.told.number(AttemptBegins), each.attempts);
+        EXPECT_EQ(line.lab.puts.size(), each.puts);
+        if (each.end == SendingPhase::Success)
+            EXPECT_EQ(line.remote().size(), 3u);
+    }
+}
+
+TEST_F(FtpSenderTest, AnEmptyFolderOnTheServerCountsAsOneFile) {
+    remote();
+    lab.putFaults = {{QString(), FakeLab::always, -1}};
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::NotAll);
+    EXPECT_EQ(told.number(Counted), 1);
+    EXPECT_EQ(told.number(Incomplete), 3);
+}
+
+TEST_F(FtpSenderTest, WritesTheBrokenFilesOneALine) {
+    lab.putFaults = {{u"01a.jpp"_s, FakeLab::always, 20}, {u"log.txt"_s, FakeLab::always, 20}};
+    lab.refusesDelete = true;
+    QByteArray seen;
+    lab.onPut = [&](const QString& name) {
+        if (name == u"02b.jpp"_s)
+            seen = *test.files.read(path(u"kashloo.txt"_s));
+    };
+    (void)sender.RunAttempts();
+    EXPECT_EQ(seen, (path(u"log.txt"_s) + u"\r\n"_s + path(u"01a.jpp"_s) + u"\r\n"_s).toLatin1());
+}
+
+TEST_F(FtpSenderTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
+    lab.folders[base][u"01a.jpp"_s] = "another's file";
+    lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
+    int sinceCut = 0;
+    lab.onConnect = [&](int) {
+        // The folder can't be entered while the remains are looked for the first time.
+        if (lab.puts.contains(u"02b.jpp"_s))
+            lab.refusesEntry = ++sinceCut == 1;
+    };
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
+    EXPECT_EQ(lab.folders[base][u"01a.jpp"_s], QByteArray("another's file"));
+    EXPECT_EQ(remote()[u"01a.jpp"_s].size(), 350);
+}
+
+TEST_F(FtpSenderTest, AStopCountsAtEveryFileAndNothingIsSentTwice) {
+    for (const QString& stopAt : {names().first(), names().last()}) {
+        Line line;
+        line.lab.onPut = [&](const QString& name) { line.sender.stop.StopFlag = name == stopAt; };
+        EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
+        EXPECT_EQ(line.told.count(Stopped), 1);
+        EXPECT_EQ(line.lab.puts.size(), names().indexOf(stopAt) + 1);
+        line.lab.onPut = {};
+        line.sender.refill();
+        EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
+        EXPECT_EQ(line.lab.puts, names());
+    }
+}
+
+// Nobody answers: a stop ends the tries, in a pass as in the check behind it.
+TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
+    for (const SendingMoment in : {AttemptBegins, CheckBegins}) {
+        Line line;
+        line.lab.deadConnects = FakeLab::always;
+        int stoppedAt = 0;
+        line.lab.onConnect = [&](int number) {
+            if (stoppedAt == 0 && line.told.count(in) > 0) {
+                stoppedAt = number;
+                line.sender.stop.StopFlag = true;
+            }
+        };
+        EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
+        EXPECT_EQ(line.lab.connects, stoppedAt);
+    }
+}
+
+TEST_F(FtpSenderTest, NothingMoreIsSentOnceTheCustomerHasLeft) {
+    lab.onPut = [&](const QString&) { sender.stop.left = true; };
+    EXPECT_EQ(sender.RunAttempts(), std::nullopt);
+    EXPECT_EQ(lab.puts.size(), 1);
+    EXPECT_EQ(told.count(Stopped), 0);
+}
+
+TEST_F(FtpSenderTest, TellsTheShareOfThePieces) {
+    const QStringList pieces{u"a_001_002.prk"_s, u"a_002_002.prk"_s};
+    for (const QString& piece : pieces)
+        EXPECT_TRUE(test.files.writeWhole(path(piece), "1"));
+    order(pieces);
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
+    ASSERT_EQ(told.pieces.size(), 2u);
+    EXPECT_EQ(told.pieces[0].first, 0.5);
+    EXPECT_EQ(told.pieces[1].first, 1.0);
+}
+
+TEST_F(FtpSenderTest, TheOlderBulkPathSendsInRounds) {
+    lab.putFaults = {{u"01a.jpp"_s, 1, -1}};
+    EXPECT_EQ(sender.runOlderRounds(), SendingPhase::Success);
+    EXPECT_EQ(told.number(RoundFailed), 1);
+    EXPECT_EQ(lab.puts.size(), 4);
+}
+
+} // namespace lumora

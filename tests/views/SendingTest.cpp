@@ -1,0 +1,221 @@
+#include "PageLook.h"
+
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "support/FakeWebLab.h"
+#include "transfer/ftp/FtpFrm.h"
+#include "transfer/http/UploadForm.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
+
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+const QString orderName = u"2026_11_21_KUP_1234^105"_s;
+const QString first = u"021015GNB0000_03AABB.jpp"_s;
+
+// The two sending pages in each phase that a customer meets, reached over a lab in memory by what a customer, a clock
+// and a line do.
+class SendingLook : public PageLook {
+protected:
+    SendingLook()
+        : walk(GetParam(),
+               u"[Addresses]\nHttpHost = http://192.0.2.10\nHttpTikiya = hazmanot\nHttpScriptPath = /hazmanot/\n"_s,
+               &lab) {
+        SessionState& state = walk.program().state();
+        lab.folders[state.profile.FtpFolder2];
+        state.MisparHazmana = u"105"_s;
+        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000\\"_s + orderName;
+        QString folder = u"C:"_s;
+        for (const QString& part : {u"\\2000lumora"_s, u"\\!!000"_s, u'\\' + orderName}) {
+            folder += part;
+            EXPECT_TRUE(files().folderExists(folder) || files().makeFolder(folder).ok());
+        }
+        for (const QString& name : {u"!105_1234.jpp"_s, first, u"111015GNB0001_03AACC.jpp"_s})
+            write(name);
+        EXPECT_TRUE(files().writeWhole(state.transfer.OrderFolder + u'\\' + orderName + u".txt"_s,
+                                       "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n"));
+    }
+
+    const Files& files() { return walk.program().platform().files; }
+    void write(const QString& name) {
+        EXPECT_TRUE(files().writeWhole(walk.program().state().transfer.OrderFolder + u'\\' + name, "bytes"));
+    }
+    FakeLab::Folder& remote() { return lab.folders[walk.program().state().profile.FtpFolder2 + u'/' + orderName]; }
+    template <class P>
+    P& open() {
+        PageChain& chain = walk.program().chain();
+        chain.unload(P::pageId);
+        chain.show(P::pageId);
+        auto& page = walk.page<P>(P::pageId);
+        QObject::connect(&page, &Page::changed, &page, [this] { lookIfDue(); });
+        return page;
+    }
+    void until(const SendingPage& page, SendingPhase phase) {
+        ASSERT_TRUE(QTest::qWaitFor([&] { return page.phase() == phase; }, 30000))
+            << qPrintable(page.sendingControls().Label4Do.text);
+    }
+    // Looks at the page from within its own work, as soon as it is so far. One after the other.
+    void lookWhen(const QString& name, std::function<bool()> soFar) { waits.emplace_back(name, std::move(soFar)); }
+    void lookIfDue() {
+        if (looking || waits.empty() || !waits.front().second())
+            return;
+        const QString name = waits.front().first;
+        waits.erase(waits.begin());
+        looking = true;
+        look(walk, name);
+        looking = false;
+    }
+
+    FakeWebLab lab;
+    Walk walk;
+    std::vector<std::pair<QString, std::function<bool()>>> waits;
+    bool looking = false;
+};
+
+void countOut(UploadForm& page) {
+    while (page.controls().Picture1Width < UploadFormControls::Picture1FullWidth)
+        page.Timer1_Tick();
+    for (int tick = 0; tick < 7; ++tick)
+        page.Timer2_Tick();
+}
+
+} // namespace
+
+TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
+    auto& page = open<FtpFrm>();
+    until(page, SendingPhase::Countdown);
+    look(walk, u"17-countdown"_s);
+    walk.press(u"FtpFrm"_s, u"Command23"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::Waiting);
+    look(walk, u"17-waiting"_s);
+    walk.press(u"FtpFrm"_s, u"Image3"_s);
+    look(walk, u"20-leave-sending"_s);
+    walk.press(u"FtpFrm"_s, u"Command14"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::Countdown);
+
+    lab.putFaults = {{first, FakeLab::always, -1}};
+    lookWhen(u"18-sending"_s, [&] { return page.phase() == SendingPhase::Sending && page.controls().percent >= 50; });
+    lookWhen(u"18-checking"_s, [&] { return page.phase() == SendingPhase::Checking; });
+    lookWhen(u"18-sending-again"_s, [&] {
+        return page.phase() == SendingPhase::Sending && !page.controls().Label34.text.isEmpty() &&
+               !page.controls().Label4File.hint.isEmpty();
+    });
+    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::NotAll);
+    EXPECT_TRUE(waits.empty());
+    look(walk, u"19-failed"_s);
+    walk.press(u"FtpFrm"_s, u"Command24"_s);
+    look(walk, u"22-for-the-lab"_s);
+    walk.press(u"FtpFrm"_s, u"Command9"_s);
+
+    lab.putFaults.clear();
+    lookWhen(u"21-reporting"_s, [&] { return page.phase() == SendingPhase::Reporting; });
+    walk.press(u"FtpFrm"_s, u"Command10"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::Success);
+    look(walk, u"21-sent"_s);
+    walk.press(u"FtpFrm"_s, u"Command28"_s);
+    EXPECT_EQ(walk.program().chain().front()->id(), PageId::hatchala);
+}
+
+TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
+    remote()[u"stranger.jpp"_s] = "x";
+    auto& there = open<FtpFrm>();
+    until(there, SendingPhase::Countdown);
+    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    EXPECT_EQ(there.phase(), SendingPhase::AllThere);
+    EXPECT_FALSE(walk.pressable(u"FtpFrm"_s, u"Command10"_s)) << "there is nothing to send again";
+    look(walk, u"24-all-there"_s);
+
+    SessionState& state = walk.program().state();
+    state.transfer.SugMishloah = Sending::Resend;
+    const QString path = state.transfer.OrderFolder + u'\\' + first;
+    remote().clear();
+    state.handOver.lines = {path, path};
+    auto& twice = open<FtpFrm>();
+    until(twice, SendingPhase::Countdown);
+    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    EXPECT_EQ(twice.phase(), SendingPhase::Unclear);
+    EXPECT_TRUE(walk.pressable(u"FtpFrm"_s, u"Command10"_s));
+    look(walk, u"24-unclear"_s);
+
+    state.handOver.lines = {path};
+    remote().clear();
+    auto& stopped = open<FtpFrm>();
+    until(stopped, SendingPhase::Countdown);
+    lab.onPut = [&](const QString&) { stopped.Command15_Click(); };
+    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    EXPECT_EQ(stopped.phase(), SendingPhase::Stopped);
+    walk.program().dialogs().closeMessages();
+    look(walk, u"24-stopped"_s);
+}
+
+TEST_P(SendingLook, ByFtpInPieces) {
+    walk.program().state().transfer.Mefurak = Travel::Pieces;
+    for (const char* name : {"a_001_003.prk", "a_002_003.prk", "a_003_003.prk"})
+        write(QString::fromLatin1(name));
+    auto& page = open<FtpFrm>();
+    until(page, SendingPhase::Countdown);
+    lookWhen(u"25-sending-pieces"_s, [&] { return page.controls().Label4Diff.visible; });
+    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    EXPECT_TRUE(waits.empty());
+}
+
+TEST_P(SendingLook, WithoutAnOrderAndWithoutAServer) {
+    SessionState& state = walk.program().state();
+    state.profile.HttpHost.clear();
+    until(open<UploadForm>(), SendingPhase::NoServer);
+    look(walk, u"68-http-no-server"_s);
+    state.profile.FtpServer.clear();
+    until(open<FtpFrm>(), SendingPhase::NoServer);
+    walk.program().dialogs().closeMessages();
+    look(walk, u"23-no-server"_s);
+    state.profile.FtpServer = u"192.0.2.10"_s;
+    state.transfer.OrderFolder.clear();
+    until(open<FtpFrm>(), SendingPhase::NoOrder);
+    look(walk, u"23-no-order"_s);
+    until(open<UploadForm>(), SendingPhase::NoOrder);
+    look(walk, u"69-http-no-order"_s);
+}
+
+TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
+    lab.deadCalls = lab.deadPosts = FakeLab::always;
+    auto& page = open<UploadForm>();
+    lookWhen(u"60-http-checking"_s, [&] { return page.controls().Pic4Hamten.visible; });
+    until(page, SendingPhase::Countdown);
+    look(walk, u"61-http-countdown"_s);
+    walk.press(u"UploadForm"_s, u"Command3"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::Waiting);
+    look(walk, u"62-http-stopped"_s);
+    walk.press(u"UploadForm"_s, u"Command10"_s);
+    lookWhen(u"63-http-sending"_s, [&] { return page.controls().percent >= 50; });
+    lookWhen(u"64-http-sending-again"_s,
+             [&] { return page.controls().percent == 25 && !page.controls().Label1.text.isEmpty(); });
+    countOut(page);
+    EXPECT_EQ(page.phase(), SendingPhase::NotAll);
+    look(walk, u"65-http-failed"_s);
+
+    lab.deadCalls = lab.deadPosts = 0;
+    lookWhen(u"66-http-verifying"_s, [&] { return page.phase() == SendingPhase::Checking; });
+    walk.press(u"UploadForm"_s, u"Image5"_s);
+    EXPECT_EQ(page.phase(), SendingPhase::Success);
+    EXPECT_TRUE(waits.empty());
+    look(walk, u"67-http-sent"_s);
+    until(open<UploadForm>(), SendingPhase::AllThere);
+    look(walk, u"70-http-all-there"_s);
+    walk.press(u"UploadForm"_s, u"Command28"_s);
+    EXPECT_EQ(walk.program().chain().front()->id(), PageId::hatchala);
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, SendingLook, PageLook::screens());
+
+} // namespace lumora
