@@ -216,6 +216,6 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     EXPECT_EQ(walk.program().chain().front()->id(), PageId::hatchala);
 }
 
-INSTANTIATE_TEST_SUITE_P(Screens, SendingLook, PageLook::screens());
+INSTANTIATE_TEST_SUITE_P(Screens, SendingLook, PageLook::screens(), PageLook::nameOf);
 
 } // namespace lumora

@@ -1,6 +1,7 @@
 #include "transfer/delivery/OrderFiles.h"
 
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
 #include "platform/files/Files.h"
@@ -16,15 +17,11 @@ constexpr int shortestFolder = 4;
 
 } // namespace
 
-bool IsOrderFolder(const QString& folder) {
-    return !folder.isEmpty() && LeafName(folder) != notChosen;
-}
-
-QStringList FtpOrderFiles(const Files& files, const QString& folder, const QStringList& entries, bool inPieces) {
+QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QStringList& entries, bool inPieces) {
     QStringList paths;
-    if (const QString log = OrderTextPath(folder); files.fileExists(log))
+    if (const QString log = order.logPath(); files.fileExists(log))
         paths += log;
-    const auto append = [&](const QString& name) { paths += JoinDrivePath(folder, name); };
+    const auto append = [&](const QString& name) { paths += order.filePath(name); };
     if (inPieces) {
         const auto sheet = std::find_if(entries.begin(), entries.end(), IsSheet);
         append(sheet == entries.end() ? QString() : *sheet);

@@ -6,14 +6,12 @@
 namespace lumora {
 
 class Files;
-
-// True if the path names an order's folder: not empty, and not the "***" of what was not chosen.
-bool IsOrderFolder(const QString& folder);
+class OrderFolder;
 
 // The files of a folder as FTP sends them: the order log first, then the print files, or the sheet and the pieces of an
 // order that travels in pieces. Without a sheet such an order has the folder itself in its place, whose put fails.
 // entries: the folder's names that match the sending page's pattern.
-QStringList FtpOrderFiles(const Files& files, const QString& folder, const QStringList& entries, bool inPieces);
+QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QStringList& entries, bool inPieces);
 
 // The same of the lines that the page of finished orders has handed over, for the older bulk path.
 QStringList BulkFiles(const QStringList& handedOver, bool inPieces);

@@ -1,5 +1,5 @@
 // What the rules of the sending tell, put into the words and controls of the page.
-#include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
@@ -140,7 +140,7 @@ void FtpFrm::reached(SendingMoment moment, int number) {
         Label2.visible = false;
         File1Enabled.enabled = false;
         Command12.visible = false;
-        Label46.text = LeafName(m_state.transfer.OrderFolder);
+        Label46.text = OrderFolder::chosen(m_state).name();
         break;
     case SendingMoment::Unreached:
         Command12.visible = true;
@@ -195,7 +195,7 @@ void FtpFrm::sending(int index, int count, const QString& name) {
         caption = QStringLiteral("%1 / %2 ").arg(index + 1).arg(count) +
                   wording(u"נא לא לסגור חלון זה עד גמר כל המשלוחים    ",
                           u"Please do not close this window until all sendings end    ") +
-                  LeafName(m_state.transfer.OrderFolder);
+                  OrderFolder::chosen(m_state).name();
     Label4File.hint = name;
     Q_EMIT changed();
 }

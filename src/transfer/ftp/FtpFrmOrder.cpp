@@ -3,7 +3,8 @@
 #include "editing/editor/gdisave.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
-#include "order/OrderNames.h"
+#include "order/OrderFolder.h"
+#include "order/PrintCode.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
@@ -28,25 +29,26 @@ bool FtpFrm::settingsFound() {
 
 void FtpFrm::clearLists() {
     m_sender.clearLists();
-    m_state.transfer.ShemTikiya = LeafName(m_state.transfer.OrderFolder);
-    if (IsOrderFolder(m_state.transfer.OrderFolder))
+    const OrderFolder order = OrderFolder::chosen(m_state);
+    m_state.transfer.ShemTikiya = order.name();
+    if (order.isChosen())
         Label46.text = m_state.transfer.ShemTikiya;
 }
 
 void FtpFrm::listFolder() {
-    const QString& folder = m_state.transfer.OrderFolder;
+    const OrderFolder order = OrderFolder::chosen(m_state);
     clearLists();
     File1Index = -1;
-    if (!IsOrderFolder(folder)) {
+    if (!order.isChosen()) {
         Label7.text = QStringLiteral("0");
         return;
     }
-    File1.setFolder(folder);
+    File1.setFolder(order.path());
     File1.refresh();
     Label7.text = QString::number(File1.count());
-    ReadOrderDetails(m_platform.files, OrderTextPath(folder), m_state.shemot);
+    ReadOrderDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
-    m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, folder, File1.names(), inPieces()));
+    m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, order, File1.names(), inPieces()));
     addProofPicture();
 }
 
@@ -61,7 +63,7 @@ void FtpFrm::countPictures() {
     names.clear();
     for (const QString& path : lists().List3.items())
         names.append(LeafName(path));
-    m_state.shemot.TotalPics = CopiesCount(names.items());
+    m_state.shemot.TotalPics = sumOfCopies(names.items(), CopiesIn::FileNames);
     Label21.text = QString::number(m_state.shemot.TotalPics);
     showCounts();
 }
@@ -104,8 +106,8 @@ void FtpFrm::beginResend() {
     enter(SendingPhase::Preparing);
     clearLists();
     m_chain.unload(PageId::MoogMeret);
-    const QString& folder = m_state.transfer.OrderFolder;
-    if (!IsOrderFolder(folder)) {
+    const OrderFolder order = OrderFolder::chosen(m_state);
+    if (!order.isChosen()) {
         Label7.text = QStringLiteral("0");
         enter(SendingPhase::NoOrder);
         return;
@@ -113,10 +115,10 @@ void FtpFrm::beginResend() {
     FtpLists& lists = m_sender.lists;
     lists.List3.append(m_handedOver);
     Label7.text = QString::number(lists.List3.count());
-    ReadResentDetails(m_platform.files, OrderTextPath(folder), m_state.shemot);
+    ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
     addProofPicture();
-    for (const QString& path : ReadBrokenFiles(m_platform.files, folder)) {
+    for (const QString& path : ReadBrokenFiles(m_platform.files, order)) {
         if (lists.List3.contains(path))
             lists.List4Broken.append(path);
     }

@@ -1,6 +1,7 @@
 // Events and routines of the sending page that no control of the program calls: the lab's manual panel, the resend from
 // the page's own file list, and the question behind a fatal error. They stay for the lab's own tests.
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
 #include "platform/Dialogs.h"
@@ -133,7 +134,7 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
     File1.refresh();
     clearLists();
     TextList& list = m_sender.lists.List3;
-    const QString log = OrderTextPath(folder);
+    const QString log = OrderFolder(folder).logPath();
     if (m_platform.files.fileExists(log))
         list.append(log);
     for (const QString& entry : File1.names()) {

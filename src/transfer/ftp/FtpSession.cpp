@@ -2,6 +2,7 @@
 
 #include "common/DrivePathText.h"
 #include "order/BrokenFiles.h"
+#include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -208,7 +209,7 @@ bool FtpSession::EnterOrderFolder() {
         return false;
     }
     QString& name = m_transfer.ShemTikiya;
-    name = LeafName(m_transfer.OrderFolder);
+    name = OrderFolder(m_transfer.OrderFolder).name();
     if (m_lists.List5.contains(name)) {
         if (!enterListedFolder(name))
             return false;
@@ -273,7 +274,7 @@ bool FtpSession::FtpSendFile(const QString& path) {
 }
 
 void FtpSession::keepBrokenFiles() {
-    const auto written = WriteBrokenFiles(m_platform.files, m_transfer.OrderFolder, m_lists.List4Broken);
+    const auto written = WriteBrokenFiles(m_platform.files, OrderFolder(m_transfer.OrderFolder), m_lists.List4Broken);
     if (!written && !std::exchange(m_notKeptTold, true))
         m_events.brokenNotKept(written.failure());
 }

@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "order/OrderReport.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -30,7 +31,7 @@ HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEve
     , m_script(platform) {}
 
 QString HttpSender::folderName() const {
-    return LeafName(m_state.transfer.OrderFolder);
+    return OrderFolder::chosen(m_state).name();
 }
 
 QString HttpSender::siteAddress(const QString& rest) const {
@@ -143,7 +144,7 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     const QString name = folderName();
     m_state.transfer.ShemTikiya = name;
     m_events.reached(SendingMoment::Answered);
-    if (lists.List4Kvazim.isEmpty() || !IsOrderFolder(order) ||
+    if (lists.List4Kvazim.isEmpty() || !OrderFolder(order).isChosen() ||
         LeafName(ParentFolder(lists.List4Kvazim.item(0))) != name)
         return ServerVerdict::OtherFolder;
     HttpFetchFileListN(listNumber);
@@ -191,7 +192,7 @@ void HttpSender::downloadList(int listNumber) {
     const Files& files = m_platform.files;
     clsDownload download(m_platform);
     // The list of an earlier check would pass for the answer of this one.
-    const QString list = JoinDrivePath(m_state.transfer.OrderFolder, ListFileName(0));
+    const QString list = OrderFolder::chosen(m_state).filePath(ListFileName(0));
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)
         m_listFailure = cleared.failure();
@@ -214,11 +215,11 @@ void HttpSender::downloadList(int listNumber) {
 }
 
 void HttpSender::HttpSendReport() const {
-    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state));
+    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot));
 }
 
 void HttpSender::HttpSendDone() const {
-    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state));
+    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state.profile, m_state.transfer));
 }
 
 void HttpSender::postTestPicture() {

@@ -1,5 +1,5 @@
 // What the rules of the sending tell, put into the words and controls of the page.
-#include "common/DrivePathText.h"
+#include "order/OrderFolder.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
 
@@ -32,7 +32,7 @@ void UploadForm::reached(SendingMoment moment, int number) {
         showLeft(number);
         break;
     case SendingMoment::Answered:
-        Label15.text = LeafName(m_state.transfer.OrderFolder);
+        Label15.text = OrderFolder::chosen(m_state).name();
         showAnswers();
         break;
     default:

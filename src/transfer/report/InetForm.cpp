@@ -27,7 +27,7 @@ QString InetForm::FetchUrlSmall(const QString& url) {
 
 void InetForm::reportOrder() {
     m_platform.pump.pump();
-    const QString query = OrderReportQuery(m_state);
+    const QString query = OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
     const QString& script = m_state.profile.ReportUrl;
     // The lab's site is used to a call of this address before each report.
     TeshuvatSharat = FetchUrlSmall(script + QStringLiteral("c.txt"));
@@ -36,7 +36,7 @@ void InetForm::reportOrder() {
 }
 
 void InetForm::reportDone() {
-    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state));
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state.profile, m_state.transfer));
     Q_EMIT changed();
 }
 
