@@ -28,30 +28,30 @@ FtpFrmView::FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& the
     frame().content()->addLayout(layOutSending(theme, progress, side), 1);
     makeBars();
     makePanels();
-    bindUnseen(page.lists().named());
+    bindLists(page.lists().named());
     start();
 }
 
 QWidget* FtpFrmView::makeProgress() {
     const auto [box, column] = makeProgressColumn();
-    const auto line = [this, column = column](const QString& name, const Caption& caption, const char* type) {
-        auto* made = label(name, caption, type);
+    const auto line = [this, column = column](const Caption& caption, const char* type) {
+        auto* made = label(caption, type);
         made->setAlignment(Qt::AlignCenter);
         column->addWidget(made);
         return made;
     };
-    line(u"Label3"_s, m_shown.Label3, "title");
-    line(u"Label4File"_s, m_shown.Label4File, "muted");
-    line(u"Label34"_s, m_shown.Label34, "strong");
+    line(m_shown.Label3, "title");
+    line(m_shown.Label4File, "muted");
+    line(m_shown.Label34, "strong");
     m_minutes = new QWidget(box);
     auto* minutes = new QHBoxLayout(m_minutes);
     minutes->setContentsMargins(0, 0, 0, 0);
     minutes->addStretch(1);
-    QLabel* title = label(u"Label4DiffTitle"_s, m_shown.Label4DiffTitle, "muted");
+    QLabel* title = label(m_shown.Label4DiffTitle, "muted");
     title->setWordWrap(false);
     minutes->addWidget(title);
-    minutes->addWidget(label(u"Label4Diff"_s, m_shown.Label4Diff, "strong"));
-    QLabel* unit = label(u"Label4Minutes"_s, m_shown.Label4Minutes, "muted");
+    minutes->addWidget(label(m_shown.Label4Diff, "strong"));
+    QLabel* unit = label(m_shown.Label4Minutes, "muted");
     unit->setWordWrap(false);
     minutes->addWidget(unit);
     minutes->addStretch(1);
@@ -63,15 +63,15 @@ QWidget* FtpFrmView::makeProgress() {
          [this] { return u"%1 %"_s.arg(m_shown.PicInProgKatanWidth * 100 / FtpFrmControls::Pic4ProgWidth); });
     column->addWidget(m_pieces, 0, Qt::AlignHCenter);
     column->addWidget(m_minutes);
-    line(u"Label4Do"_s, m_shown.Label4Do, "body");
+    line(m_shown.Label4Do, "body");
     column->addStretch(1);
 
     SendingCard failure = makeSignedCard(theme(), box, "alarm", u"warning"_s, Theme::Colour::Danger);
     column->addWidget(bindFailure(failure));
-    failure.column->addWidget(label(u"Picture6"_s, m_shown.Picture6, "strong"));
-    failure.column->addWidget(label(u"Label2"_s, m_shown.Label2));
-    failure.column->addWidget(label(u"Label4Reason"_s, m_shown.Label4Reason));
-    failure.column->addWidget(label(u"Label9"_s, m_shown.Label9));
+    failure.column->addWidget(label(m_shown.Picture6, "strong"));
+    failure.column->addWidget(label(m_shown.Label2));
+    failure.column->addWidget(label(m_shown.Label4Reason));
+    failure.column->addWidget(label(m_shown.Label9));
     return box;
 }
 
@@ -79,19 +79,19 @@ QWidget* FtpFrmView::makeSide() {
     const CardColumn cards = makeCardColumn(theme(), this);
     const auto [order, orderLines] = cards.add("card");
     m_order = order;
-    orderLines->addWidget(label(u"Label4Order"_s, m_shown.Label4Order, "smallMuted"));
+    orderLines->addWidget(label(m_shown.Label4Order, "smallMuted"));
     m_orderName = makeLabel(order, "strong");
     bind(u"Label46"_s, m_orderName, [this] { return m_shown.Label46.text; });
     orderLines->addWidget(m_orderName);
-    orderLines->addWidget(label(u"Label4Counts"_s, m_shown.Label4Counts));
+    orderLines->addWidget(label(m_shown.Label4Counts));
     orderLines->addWidget(button(
-                              u"Image4"_s, m_shown.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s),
+                              m_shown.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"folder"_s),
                           0, Qt::AlignLeading);
 
     const auto [delivery, deliveryLines] = cards.add("notice");
     m_delivery = delivery;
-    deliveryLines->addWidget(label(u"Label15"_s, m_shown.Label15, "strong"));
-    deliveryLines->addWidget(label(u"Label4Ktovet"_s, m_shown.Label4Ktovet));
+    deliveryLines->addWidget(label(m_shown.Label15, "strong"));
+    deliveryLines->addWidget(label(m_shown.Label4Ktovet));
 
     const auto [summary, summaryLines] = cards.add("card");
     m_summary = summary;
@@ -99,7 +99,7 @@ QWidget* FtpFrmView::makeSide() {
     auto* sign = new QLabel(summary);
     sign->setPixmap(theme().icon(u"document"_s, theme().px(28), Theme::Colour::Primary));
     head->addWidget(sign);
-    head->addWidget(label(u"Label4Summary"_s, m_shown.Label4Summary, "large"), 1);
+    head->addWidget(label(m_shown.Label4Summary, "large"), 1);
     summaryLines->addLayout(head);
     m_summaryLines = makeLabel(summary, "body");
     bind(u"Picture2"_s, m_summaryLines, [this] { return m_shown.Picture2Lines.join(u'\n'); });
@@ -111,30 +111,28 @@ QWidget* FtpFrmView::makeSide() {
     cards.column->addWidget(m_proof, 1);
     cards.column->addStretch(1);
     auto* fault = button(
-        u"Command22"_s, m_shown.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
+        m_shown.Command22, Role::Plain, [this] { m_page.Command22_Click(); }, u"resend"_s);
     cards.column->addWidget(fault, 0, Qt::AlignLeading);
-    cards.column->addWidget(
-        button(
-            u"Command24"_s, m_shown.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s),
-        0, Qt::AlignLeading);
+    cards.column->addWidget(button(
+                                m_shown.Command24, Role::Quiet, [this] { m_page.Command24_Click(); }, u"info"_s),
+                            0, Qt::AlignLeading);
     return cards.box;
 }
 
 void FtpFrmView::makeBars() {
     frame().addHeaderAction(button(
-        u"Image3"_s, m_shown.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
-    frame().addSecondaryAction(
-        button(u"Command11"_s, m_shown.Command11, Role::Secondary, [this] { m_page.Command11_Click(); }));
+        m_shown.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
+    frame().addSecondaryAction(button(m_shown.Command11, Role::Secondary, [this] { m_page.Command11_Click(); }));
     frame().addSecondaryAction(button(
-        u"Command15"_s, m_shown.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"stop"_s));
+        m_shown.Command15, Role::Secondary, [this] { m_page.Command15_Click(); }, u"stop"_s));
     m_count = button(
-        u"Command23"_s, m_shown.Command23, Role::Secondary, [this] { m_page.Command23_Click(); }, u"pause"_s);
+        m_shown.Command23, Role::Secondary, [this] { m_page.Command23_Click(); }, u"pause"_s);
     frame().addSecondaryAction(m_count);
-    QLabel* prints = label(u"Label4Prints"_s, m_shown.Label4Prints, "large");
+    QLabel* prints = label(m_shown.Label4Prints, "large");
     prints->setWordWrap(false);
     frame().addStatus(prints);
-    auto* again = button(u"Command10"_s, m_shown.Command10, Role::Main, [this] { m_page.Command10_Click(); });
-    m_sendNow = button(u"Image5"_s, m_shown.Image5, Role::Main, [this] { m_page.Image5_Click(); });
+    auto* again = button(m_shown.Command10, Role::Main, [this] { m_page.Command10_Click(); });
+    m_sendNow = button(m_shown.Image5, Role::Main, [this] { m_page.Image5_Click(); });
     frame().addMainAction(newOrderButton(m_shown.Command28, [this] { m_page.Command28_Click(); }));
     frame().addMainAction(asMain(SendingButton::SendAgain, again));
     frame().addMainAction(asMain(SendingButton::SendNow, m_sendNow));
@@ -142,12 +140,12 @@ void FtpFrmView::makeBars() {
 
 void FtpFrmView::makePanels() {
     m_leave = new Overlay(theme(), this);
-    m_leave->column()->addWidget(label(u"Picture7"_s, m_shown.Picture7, "large"));
+    m_leave->column()->addWidget(label(m_shown.Picture7, "large"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
-    row->addWidget(button(u"Command16"_s, m_shown.Command16, Role::Danger, [this] { m_page.Command16_Click(); }));
+    row->addWidget(button(m_shown.Command16, Role::Danger, [this] { m_page.Command16_Click(); }));
     row->addStretch(1);
-    auto* stay = button(u"Command14"_s, m_shown.Command14, Role::Main, [this] { m_page.Command14_Click(); });
+    auto* stay = button(m_shown.Command14, Role::Main, [this] { m_page.Command14_Click(); });
     row->addWidget(stay);
     m_leave->column()->addLayout(row);
     m_leave->setCardWidth(900);
@@ -160,7 +158,7 @@ void FtpFrmView::makePanels() {
     auto* lists = new QGridLayout;
     lists->setSpacing(theme().px(8));
     const auto show = [&](int column, const QString& name, const TextList& list, const Caption& head) {
-        QLabel* title = label(m_shown.nameOf(head), head, "smallMuted");
+        QLabel* title = label(head, "smallMuted");
         auto* widget = new QListWidget(m_labArea);
         widget->setFocusPolicy(Qt::NoFocus);
         bindList(name, list, widget, [](const QString& item) { return item.contains(u'\\') ? LeafName(item) : item; });
@@ -178,20 +176,20 @@ void FtpFrmView::makePanels() {
     auto* manual = new QGridLayout;
     manual->setSpacing(theme().px(8));
     int at = 0;
-    const auto add = [&](const QString& name, const Caption& caption, void (FtpFrm::*handler)()) {
-        manual->addWidget(button(name, caption, Role::Plain, [&page = m_page, handler] { (page.*handler)(); }), at / 5,
+    const auto addButton = [&](const Caption& caption, void (FtpFrm::*handler)()) {
+        manual->addWidget(button(caption, Role::Plain, [&page = m_page, handler] { (page.*handler)(); }), at / 5,
                           at % 5);
         ++at;
     };
-    add(u"Command13"_s, m_shown.Command13, &FtpFrm::Command13_Click);
-    add(u"Command1"_s, m_shown.Command1, &FtpFrm::Command1_Click);
-    add(u"Command2"_s, m_shown.Command2, &FtpFrm::Command2_Click);
-    add(u"Command4"_s, m_shown.Command4, &FtpFrm::Command4_Click);
-    add(u"Command17"_s, m_shown.Command17, &FtpFrm::Command17_Click);
-    add(u"Command19"_s, m_shown.Command19, &FtpFrm::Command19_Click);
-    add(u"Command25"_s, m_shown.Command25, &FtpFrm::Command25_Click);
+    addButton(m_shown.Command13, &FtpFrm::Command13_Click);
+    addButton(m_shown.Command1, &FtpFrm::Command1_Click);
+    addButton(m_shown.Command2, &FtpFrm::Command2_Click);
+    addButton(m_shown.Command4, &FtpFrm::Command4_Click);
+    addButton(m_shown.Command17, &FtpFrm::Command17_Click);
+    addButton(m_shown.Command19, &FtpFrm::Command19_Click);
+    addButton(m_shown.Command25, &FtpFrm::Command25_Click);
     m_labArea->column()->addLayout(manual);
-    auto* close = button(u"Command9"_s, m_shown.Command9, Role::Main, [this] { m_page.Command9_Click(); });
+    auto* close = button(m_shown.Command9, Role::Main, [this] { m_page.Command9_Click(); });
     m_labArea->column()->addWidget(close, 0, Qt::AlignTrailing);
     m_labArea->setFirstFocus(close);
     connect(m_labArea, &Overlay::escaped, this, [this] { m_page.Command9_Click(); });

@@ -41,17 +41,13 @@ QPushButton* SendingView::asMain(SendingButton action, QPushButton* button) {
 }
 
 QPushButton* SendingView::newOrderButton(const Caption& caption, std::function<void()> clicked) {
-    return asMain(SendingButton::NewOrder, button(u"Command28"_s, caption, Role::Secondary, std::move(clicked)));
+    return asMain(SendingButton::NewOrder, button(caption, Role::Secondary, std::move(clicked)));
 }
 
-void SendingView::bindUnseen(const std::vector<std::pair<const char16_t*, const TextList*>>& lists) {
+void SendingView::bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists) {
     for (const auto& [name, list] : lists) {
         if (!control(QString::fromUtf16(name)))
             bindList(QString::fromUtf16(name), *list);
-    }
-    for (const Controls::Entry& entry : m_page.controls().all()) {
-        if (!control(entry.name))
-            bindHidden(entry.name, *entry.caption);
     }
 }
 

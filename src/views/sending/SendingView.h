@@ -30,8 +30,8 @@ protected:
     // The button that is the main action in the phases whose row names it.
     QPushButton* asMain(SendingButton action, QPushButton* button);
     QPushButton* newOrderButton(const Caption& caption, std::function<void()> clicked);
-    // Lists of the rules, and all controls of the page that no widget shows.
-    void bindUnseen(const std::vector<std::pair<const char16_t*, const TextList*>>& lists);
+    // The lists of the rules, for scenarios and tests.
+    void bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists);
 
     void renderPhase();
 

@@ -17,20 +17,20 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
     QWidget* side = makeSide();
     frame().content()->addLayout(layOutSending(theme, progress, side), 1);
     makeBars();
-    bindUnseen(page.lists().named());
+    bindLists(page.lists().named());
     start();
 }
 
 QWidget* UploadFormView::makeProgress() {
     const auto [box, column] = makeProgressColumn();
-    const auto line = [this, column = column](const QString& name, const Caption& caption, const char* type) {
-        QLabel* made = label(name, caption, type);
+    const auto line = [this, column = column](const Caption& caption, const char* type) {
+        QLabel* made = label(caption, type);
         made->setAlignment(Qt::AlignCenter);
         column->addWidget(made);
     };
-    line(u"Label4Count"_s, m_shown.Label4Count, "title");
-    line(u"Label4File"_s, m_shown.Label4File, "muted");
-    line(u"Label4Do"_s, m_shown.Label4Do, "body");
+    line(m_shown.Label4Count, "title");
+    line(m_shown.Label4File, "muted");
+    line(m_shown.Label4Do, "body");
     column->addStretch(1);
 
     // The same words in two dresses: on the way they are no reason to worry.
@@ -43,8 +43,8 @@ QWidget* UploadFormView::makeProgress() {
     trouble.column->addWidget(m_troubleReason);
     const SendingCard failure = makeSignedCard(theme(), box, "alarm", u"warning"_s, Theme::Colour::Danger);
     column->addWidget(bindFailure(failure));
-    failure.column->addWidget(label(u"Label1"_s, m_shown.Label1, "strong"));
-    failure.column->addWidget(label(u"Label4Reason"_s, m_shown.Label4Reason));
+    failure.column->addWidget(label(m_shown.Label1, "strong"));
+    failure.column->addWidget(label(m_shown.Label4Reason));
     return box;
 }
 
@@ -52,41 +52,39 @@ QWidget* UploadFormView::makeSide() {
     const CardColumn cards = makeCardColumn(theme(), this);
     const auto [order, orderLines] = cards.add("card");
     m_order = order;
-    orderLines->addWidget(label(u"Label4Order"_s, m_shown.Label4Order, "smallMuted"));
+    orderLines->addWidget(label(m_shown.Label4Order, "smallMuted"));
     m_orderName = makeLabel(order, "strong");
     bind(u"Label15"_s, m_orderName, [this] { return m_shown.Label15.text; });
     orderLines->addWidget(m_orderName);
-    orderLines->addWidget(label(u"Label4Left"_s, m_shown.Label4Left));
-    orderLines->addWidget(label(u"Label4Tel"_s, m_shown.Label4Tel));
+    orderLines->addWidget(label(m_shown.Label4Left));
+    orderLines->addWidget(label(m_shown.Label4Tel));
 
     const auto [end, endLines] = cards.add("notice");
     m_end = end;
-    endLines->addWidget(label(u"Label4Alu"_s, m_shown.Label4Alu, "large"));
-    endLines->addWidget(label(u"Label4Rshom"_s, m_shown.Label4Rshom, "body"));
+    endLines->addWidget(label(m_shown.Label4Alu, "large"));
+    endLines->addWidget(label(m_shown.Label4Rshom, "body"));
     m_endName = makeLabel(end, "large");
     bind(u"Label16"_s, m_endName, [this] { return m_shown.Label16.text; });
     endLines->addWidget(m_endName);
-    endLines->addWidget(label(u"Label4Tashlum"_s, m_shown.Label4Tashlum, "body"));
+    endLines->addWidget(label(m_shown.Label4Tashlum, "body"));
     m_endPhone = makeLabel(end, "large");
     endLines->addWidget(m_endPhone);
     cards.column->addStretch(1);
-    cards.column->addWidget(
-        button(
-            u"Command2"_s, m_shown.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }, u"resend"_s),
-        0, Qt::AlignLeading);
+    cards.column->addWidget(button(
+                                m_shown.Command2, Role::Quiet, [this] { m_page.Command2_Click(); }, u"resend"_s),
+                            0, Qt::AlignLeading);
     return cards.box;
 }
 
 void UploadFormView::makeBars() {
     frame().addHeaderAction(button(
-        u"Image3"_s, m_shown.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
+        m_shown.Image3, Role::Quiet, [this] { m_page.Image3_Click(); }, u"exit"_s));
     m_stop = button(
-        u"Command3"_s, m_shown.Command3, Role::Secondary, [this] { m_page.Command3_Click(); }, u"pause"_s);
+        m_shown.Command3, Role::Secondary, [this] { m_page.Command3_Click(); }, u"pause"_s);
     frame().addSecondaryAction(asMain(SendingButton::Hold, m_stop));
-    auto* goOn = button(u"Command10"_s, m_shown.Command10, Role::Main, [this] { m_page.Command10_Click(); });
-    auto* again = button(u"Image5"_s, m_shown.Image5, Role::Main, [this] { m_page.Image5_Click(); });
-    frame().addSecondaryAction(
-        button(u"endClose"_s, m_shown.endClose, Role::Secondary, [this] { m_page.Image3_Click(); }));
+    auto* goOn = button(m_shown.Command10, Role::Main, [this] { m_page.Command10_Click(); });
+    auto* again = button(m_shown.Image5, Role::Main, [this] { m_page.Image5_Click(); });
+    frame().addSecondaryAction(button(m_shown.endClose, Role::Secondary, [this] { m_page.Image3_Click(); }));
     frame().addMainAction(newOrderButton(m_shown.Command28, [this] { m_page.Command28_Click(); }));
     frame().addMainAction(asMain(SendingButton::GoOn, goOn));
     frame().addMainAction(asMain(SendingButton::SendAgain, again));
