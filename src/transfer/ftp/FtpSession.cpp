@@ -13,7 +13,7 @@ namespace lumora {
 
 namespace {
 
-constexpr int pauseRounds = 1600;
+constexpr int ftpPauseRounds = 1600;
 constexpr int openAttempts = 4;
 constexpr int connectAttempts = 5;
 constexpr int folderAttribute = 16;
@@ -58,7 +58,7 @@ void FtpSession::takeSettings() {
 
 void FtpSession::PauseBar(int times) {
     for (int time = 0; time < times; ++time)
-        pauseInRounds(pauseRounds, m_events, m_platform.pump, m_stop);
+        pauseInRounds(ftpPauseRounds, m_events, m_platform.pump, m_stop);
 }
 
 void FtpSession::pump() {

@@ -17,7 +17,7 @@ namespace lumora {
 
 namespace {
 
-constexpr int pauseRounds = 1801;
+constexpr int httpPauseRounds = 1801;
 // A list is some lines of names; what is larger is none.
 constexpr qint64 largestList = 4 * 1024 * 1024;
 const QString testFolder = QStringLiteral("tttt");
@@ -40,7 +40,7 @@ QString HttpSender::siteAddress(const QString& rest) const {
 
 void HttpSender::HttpPause(int times) {
     for (int time = 0; time < times; ++time)
-        pauseInRounds(pauseRounds, m_events, m_platform.pump, m_stop);
+        pauseInRounds(httpPauseRounds, m_events, m_platform.pump, m_stop);
 }
 
 QString HttpSender::FetchUrl(const QString& url) const {

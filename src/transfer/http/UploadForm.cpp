@@ -11,18 +11,18 @@ namespace lumora {
 namespace {
 
 constexpr int panelTick = 1;
-constexpr int countdownTick = 1000;
+constexpr int httpSecond = 1000;
 constexpr int panelStep = 6;
-constexpr int countdownFrom = 5;
+constexpr int httpCountFrom = 5;
 // The count is over a second behind its nought.
-constexpr int countdownEnd = 0;
+constexpr int httpCountEnd = 0;
 
 } // namespace
 
 UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain& chain)
-    : SendingPage(PageId::UploadForm, state, platform, chain, *this, Countdown(countdownFrom, countdownEnd))
+    : SendingPage(PageId::UploadForm, state, platform, chain, *this, Countdown(httpCountFrom, httpCountEnd))
     , Timer1(panelTick, [this] { growPanel(); })
-    , Timer2(countdownTick, [this] { countSecond(); })
+    , Timer2(httpSecond, [this] { countSecond(); })
     , m_sender(state, platform, *this) {
     showAnswers();
 }

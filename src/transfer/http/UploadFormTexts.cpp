@@ -11,31 +11,31 @@ namespace {
 
 using enum SendingButton;
 
-constexpr SendingWords sendingTitle{u"שליחת ההזמנה", u"Sending your order"};
-constexpr SendingWords sentTitle{u"ההזמנה נשלחה", u"Your order was sent"};
-constexpr SendingWords notCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
-constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
-                                  u"The whole order has arrived. You can close the program or begin a new order."};
+constexpr SendingWords httpSendingTitle{u"שליחת ההזמנה", u"Sending your order"};
+constexpr SendingWords httpSentTitle{u"ההזמנה נשלחה", u"Your order was sent"};
+constexpr SendingWords httpNotCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
+constexpr SendingWords httpSentAdvice{u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
+                                      u"The whole order has arrived. You can close the program or begin a new order."};
 
-constexpr std::array looks{
+constexpr std::array httpLooks{
     PhaseLook{SendingPhase::Preparing,
               SendingSign::Asking,
               None,
               {},
-              sendingTitle,
+              httpSendingTitle,
               {u"קוראים את ההזמנה ובודקים מה כבר הגיע לשרת. נא להמתין.",
                u"Reading the order and checking what is on the server already. Please wait."}},
     PhaseLook{SendingPhase::NoOrder,
               SendingSign::Bad,
               NewOrder,
               {NewOrder, Close, Refresh},
-              notCompleteTitle,
+              httpNotCompleteTitle,
               {u"אין כאן הזמנה לשליחה.", u"There is no order to send here."}},
     PhaseLook{SendingPhase::NoServer,
               SendingSign::Bad,
               NewOrder,
               {NewOrder, Close, Refresh},
-              notCompleteTitle,
+              httpNotCompleteTitle,
               {u"לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות.",
                u"No server is set for orders. The order is kept on this computer. Please tell the shop."}},
     PhaseLook{SendingPhase::Countdown,
@@ -56,28 +56,28 @@ constexpr std::array looks{
               SendingSign::Percent,
               None,
               {},
-              sendingTitle,
+              httpSendingTitle,
               {u"ההזמנה נשלחת. נא לא לסגור את התוכנה.", u"The order is being sent. Please do not close the program."}},
     PhaseLook{SendingPhase::Checking,
               SendingSign::Asking,
               None,
               {},
-              sendingTitle,
+              httpSendingTitle,
               {u"בודקים אילו קבצים הגיעו לשרת. נא להמתין.", u"Checking which files have arrived. Please wait."}},
     PhaseLook{SendingPhase::Reporting,
               SendingSign::Percent,
               None,
               {},
-              sendingTitle,
+              httpSendingTitle,
               {u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
                u"The whole order has arrived. Telling the shop, please wait."}},
-    PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
-    PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
+    PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, httpSentTitle, httpSentAdvice},
+    PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, httpSentTitle, httpSentAdvice},
     PhaseLook{SendingPhase::NotAll,
               SendingSign::Bad,
               SendAgain,
               {SendAgain, NewOrder, Refresh},
-              notCompleteTitle,
+              httpNotCompleteTitle,
               {u"ההזמנה שמורה במחשב זה. יש להמתין מעט וללחוץ על הלחצן שלח שוב.",
                u"The order is kept on this computer. Wait a little, then press Send again."}},
 };
@@ -87,8 +87,8 @@ constexpr std::array looks{
 // Stopped and Unclear are no phases of this page.
 const PhaseLook& UploadForm::lookOf(SendingPhase phase) const {
     const auto* row =
-        std::find_if(looks.begin(), looks.end(), [&](const PhaseLook& each) { return each.phase == phase; });
-    return row == looks.end() ? looks.back() : *row;
+        std::find_if(httpLooks.begin(), httpLooks.end(), [&](const PhaseLook& each) { return each.phase == phase; });
+    return row == httpLooks.end() ? httpLooks.back() : *row;
 }
 
 void UploadForm::showPhase(const PhaseLook& row) {
