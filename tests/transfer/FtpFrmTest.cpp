@@ -60,7 +60,7 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
          false},
         {SendingPhase::Stopped,
          [](Line& line) { line.lab.onPut = [&](const QString&) { line.rig.page().Command15_Click(); }; },
-         u"נעצר לאחר הקובץ הנוכחי"_s,
+         u" סיים להעלות קובץ1"_s,
          {},
          false},
     };
