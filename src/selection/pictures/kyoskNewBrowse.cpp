@@ -206,6 +206,7 @@ void kyoskNew::showLarge(const QString& path) {
         m_rotation == 0 ? *picture : Bitmap(picture->image().transformed(QTransform().rotate(m_rotation)));
     Image4.visible = true;
     m_guide = Guide::None;
+    Picture2.text.clear();
     Picture2.guide.clear();
 
     const PrintGrade grade = printGrade(*size);

@@ -174,6 +174,7 @@ void kyoskNew::showGuide(Guide guide) {
                   u"Press a picture to choose it for print\nThe plus and minus keys add copies and cancel");
         break;
     }
+    Picture2.text = Picture2.guide.join(u'\n');
     Picture2.bitmap = Bitmap();
     Picture2.poor = false;
     Image4.visible = false;

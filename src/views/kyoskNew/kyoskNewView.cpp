@@ -50,8 +50,7 @@ void breakLong(QPushButton& button) {
 } // namespace
 
 kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Theme& theme)
-    : PageView(page, state, theme)
-    , m_page(page)
+    : ViewOf(page, state, theme)
     , m_shown(page.controls()) {
     frame().steps().setStep(OrderStep::Pictures);
     frame().setTitleVisible(false);
@@ -77,7 +76,6 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     makeClosingPanel();
     makeBranchPanel();
     makeCompressionPanel();
-    bindTheRest();
     m_focusRequest = page.focusRequest();
     start();
 }
@@ -87,16 +85,15 @@ QLayout* kyoskNewView::makeTopRow() {
     row->setSpacing(theme().px(10));
     auto* words = new QVBoxLayout;
     words->setSpacing(0);
-    words->addWidget(label(u"Title"_s, m_shown.Title, "large"));
+    words->addWidget(label(m_shown.Title, "large"));
     m_folder = makeLabel(this, "smallMuted");
     m_folder->setWordWrap(false);
-    bind(u"Label29"_s, m_folder, [this] { return m_shown.Label29.text; });
+    bindName(m_folder, m_shown.Label29);
     words->addWidget(m_folder);
     row->addLayout(words, 1);
-    row->addWidget(button(
-        u"Command14"_s, m_shown.Command14, Role::Plain, [this] { m_page.Command14_Click(); }, u"check-circle"_s));
-    m_previous = button(u"Image15"_s, m_shown.Image15, Role::Plain, [this] { m_page.Image15_Click(); });
-    m_next = button(u"Image16"_s, m_shown.Image16, Role::Plain, [this] { m_page.Image16_Click(); });
+    row->addWidget(button(m_shown.Command14, Role::Plain, &kyoskNew::Command14_Click, u"check-circle"_s));
+    m_previous = button(m_shown.Image15, Role::Plain, &kyoskNew::Image15_Click);
+    m_next = button(m_shown.Image16, Role::Plain, &kyoskNew::Image16_Click);
     row->addWidget(m_previous);
     row->addWidget(m_next);
     return row;
@@ -107,7 +104,7 @@ QWidget* kyoskNewView::makeGrid() {
     auto* grid = new QGridLayout(box);
     grid->setContentsMargins(0, 0, 0, 0);
     grid->setSpacing(theme().px(10));
-    bind(u"Frame1"_s, box, [this] { return m_shown.Frame1.text; });
+    bindName(box, m_shown.Frame1);
     for (int i = 0; i < static_cast<int>(cellsOfPage); ++i) {
         const auto at = static_cast<std::size_t>(i);
         auto* cell = new PictureCell(theme(), box);
@@ -125,13 +122,11 @@ QWidget* kyoskNewView::makeGrid() {
                 return;
             m_cells[static_cast<std::size_t>(next)]->setFocus(Qt::TabFocusReason);
         });
-        const auto numbered = [i](const char* name) { return u"%1(%2)"_s.arg(QLatin1StringView(name)).arg(i); };
-        bind(numbered("Picture1"), cell, [this, at] { return m_shown.List2.item(static_cast<int>(at)); });
-        bind(numbered("Picture4"), cell->mark(), [this, at] { return m_shown.Picture4[at].text; });
-        bind(numbered("Label4"), cell->copies(), [this, at] { return m_shown.Label4[at].text; });
-        bind(numbered("Command12"), cell->plus(), [this, at] { return m_shown.Command12[at].text; });
-        bind(numbered("Command13"), cell->minus(), [this, at] { return m_shown.Command13[at].text; });
-        bindHidden(numbered("Label5"), m_shown.Label5[at]);
+        bindName(cell, m_shown.Picture1[at]);
+        bindName(cell->mark(), m_shown.Picture4[at]);
+        bindName(cell->copies(), m_shown.Label4[at]);
+        bindName(cell->plus(), m_shown.Command12[at]);
+        bindName(cell->minus(), m_shown.Command13[at]);
         grid->addWidget(cell, i / columns, i % columns);
     }
     for (int i = 0; i < columns; ++i)
@@ -149,12 +144,11 @@ QWidget* kyoskNewView::makeEmpty() {
     sign->setPixmap(theme().icon(u"pictures"_s, theme().px(96), Theme::Colour::Primary));
     sign->setAlignment(Qt::AlignCenter);
     column->addWidget(sign);
-    for (QLabel* words : {label(u"emptyHead"_s, m_shown.emptyHead, "title"), label(u"Label25"_s, m_shown.Label25)}) {
+    for (QLabel* words : {label(m_shown.emptyHead, "title"), label(m_shown.Label25)}) {
         words->setAlignment(Qt::AlignCenter);
         column->addWidget(words);
     }
-    m_firstFolder = button(
-        u"firstFolder"_s, m_shown.firstFolder, Role::Main, [this] { m_page.Image5_Click(); }, u"folder-plus"_s);
+    m_firstFolder = button(m_shown.firstFolder, Role::Main, &kyoskNew::Image5_Click, u"folder-plus"_s);
     column->addWidget(m_firstFolder, 0, Qt::AlignCenter);
     column->addStretch(1);
     return box;
@@ -171,15 +165,13 @@ QWidget* kyoskNewView::makeSide() {
     inside->setContentsMargins(theme().px(14), theme().px(14), theme().px(14), theme().px(10));
     inside->setSpacing(theme().px(6));
     m_large = new LargePicture(theme(), card);
-    bind(u"Picture2"_s, m_large, [this] { return m_shown.Picture2.guide.join(u'\n'); });
+    bindName(m_large, m_shown.Picture2);
     connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
     inside->addWidget(m_large, 1);
-    auto* grade = label(u"Label6"_s, m_shown.Label6, "strong");
+    auto* grade = label(m_shown.Label6, "strong");
     grade->setAlignment(Qt::AlignCenter);
     inside->addWidget(grade);
-    inside->addWidget(button(
-                          u"Image4"_s, m_shown.Image4, Role::Plain, [this] { m_page.Image4_Click(); }, u"rotate"_s),
-                      0, Qt::AlignCenter);
+    inside->addWidget(button(m_shown.Image4, Role::Plain, &kyoskNew::Image4_Click, u"rotate"_s), 0, Qt::AlignCenter);
     column->addWidget(card, 1);
 
     auto* offerCard = new QFrame(box);
@@ -187,79 +179,71 @@ QWidget* kyoskNewView::makeSide() {
     auto* offer = new QVBoxLayout(offerCard);
     offer->setContentsMargins(theme().px(14), theme().px(10), theme().px(14), theme().px(12));
     offer->setSpacing(theme().px(6));
-    auto* offerText = label(u"Label35"_s, m_shown.Label35, "strong");
+    auto* offerText = label(m_shown.Label35, "strong");
     offerText->setAlignment(Qt::AlignCenter);
     offer->addWidget(offerText);
     m_offerButtons = {
-        button(u"Command24"_s, m_shown.Command24, Role::Plain, [this] { m_page.Command24_Click(); }),
-        button(u"Command25"_s, m_shown.Command25, Role::Plain, [this] { m_page.Command25_Click(); }),
-        button(u"Command23"_s, m_shown.Command23, Role::Quiet, [this] { m_page.Command23_Click(); }),
+        button(m_shown.Command24, Role::Plain, &kyoskNew::Command24_Click),
+        button(m_shown.Command25, Role::Plain, &kyoskNew::Command25_Click),
+        button(m_shown.Command23, Role::Quiet, &kyoskNew::Command23_Click),
     };
     for (QPushButton* answer : m_offerButtons) {
         setRole(answer, "tall");
         offer->addWidget(answer);
     }
-    bind(u"Picture66"_s, offerCard, m_shown.Picture66);
+    bind(offerCard, m_shown.Picture66);
     column->addWidget(offerCard);
-    column->addWidget(button(
-        u"Image33"_s, m_shown.Image33, Role::Plain, [this] { m_page.Image33_Click(); }, u"shop"_s));
+    column->addWidget(button(m_shown.Image33, Role::Plain, &kyoskNew::Image33_Click, u"shop"_s));
     return box;
 }
 
 void kyoskNewView::makeBars() {
-    frame().addHeaderAction(button(
-        u"Image11"_s, m_shown.Image11, Role::Quiet, [this] { m_page.Image11_Click(); }, u"tag"_s));
-    frame().addHeaderAction(button(
-        u"Image6"_s, m_shown.Image6, Role::Quiet, [this] { m_page.Image6_Click(); }, u"info"_s));
-    frame().addHeaderAction(button(
-        u"Image10"_s, m_shown.Image10, Role::Quiet, [this] { m_page.Image10_Click(); }, u"exit"_s));
-    frame().addSecondaryAction(button(
-        u"Image5"_s, m_shown.Image5, Role::Secondary, [this] { m_page.Image5_Click(); }, u"folder-plus"_s));
-    frame().addSecondaryAction(button(
-        u"Image8"_s, m_shown.Image8, Role::Quiet, [this] { m_page.Image8_Click(); }, u"eraser"_s));
+    frame().addHeaderAction(button(m_shown.Image11, Role::Quiet, &kyoskNew::Image11_Click, u"tag"_s));
+    frame().addHeaderAction(button(m_shown.Image6, Role::Quiet, &kyoskNew::Image6_Click, u"info"_s));
+    frame().addHeaderAction(button(m_shown.Image10, Role::Quiet, &kyoskNew::Image10_Click, u"exit"_s));
+    frame().addSecondaryAction(button(m_shown.Image5, Role::Secondary, &kyoskNew::Image5_Click, u"folder-plus"_s));
+    frame().addSecondaryAction(button(m_shown.Image8, Role::Quiet, &kyoskNew::Image8_Click, u"eraser"_s));
 
     auto* total = new QFrame(this);
     auto* row = new QHBoxLayout(total);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(theme().px(10));
-    const auto word = [&](const QString& name, const Caption& caption, const char* type) {
-        auto* made = label(name, caption, type);
-        made->setWordWrap(false);
-        row->addWidget(made);
-    };
-    word(u"Label7Prompt"_s, m_shown.Label7Prompt, "body");
-    word(u"Label7"_s, m_shown.Label7, "title");
+    row->addWidget(lineLabel(m_shown.Label7Prompt));
+    row->addWidget(lineLabel(m_shown.Label7, "title"));
     row->addSpacing(theme().px(14));
-    word(u"Label15"_s, m_shown.Label15, "muted");
+    row->addWidget(lineLabel(m_shown.Label15, "muted"));
     frame().addStatus(total);
 
-    frame().addMainAction(button(u"Image13"_s, m_shown.Image13, Role::Main, [this] { m_page.Image13_Click(); }));
-    frame().addMainAction(button(u"Image7"_s, m_shown.Image7, Role::Main, [this] { m_page.Image7_Click(); }));
+    frame().addMainAction(button(m_shown.Image13, Role::Main, &kyoskNew::Image13_Click));
+    frame().addMainAction(button(m_shown.Image7, Role::Main, &kyoskNew::Image7_Click));
+}
+
+void kyoskNewView::addAnswers(Overlay& panel, QPushButton* other, QPushButton* first) {
+    auto* row = new QHBoxLayout;
+    row->setSpacing(theme().gap());
+    row->addWidget(other);
+    row->addStretch(1);
+    row->addWidget(first);
+    panel.column()->addLayout(row);
+    panel.setFirstFocus(first);
 }
 
 void kyoskNewView::makeLeavePanel() {
     m_leave = new Overlay(theme(), this);
-    m_leave->column()->addWidget(label(u"Label11"_s, m_shown.Label11, "large"));
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme().gap());
-    row->addWidget(button(
-        u"Command15"_s, m_shown.Command15, Role::Danger, [this] { m_page.Command15_Click(); }, u"exit"_s));
-    row->addStretch(1);
-    auto* stay = button(u"Command4"_s, m_shown.Command4, Role::Main, [this] { m_page.Command4_Click(); });
-    row->addWidget(stay);
-    m_leave->column()->addLayout(row);
-    m_leave->setFirstFocus(stay);
-    connect(m_leave, &Overlay::escaped, this, [this] { m_page.Command4_Click(); });
+    m_leave->column()->addWidget(label(m_shown.Label11, "large"));
+    auto* leave = button(m_shown.Command15, Role::Danger, &kyoskNew::Command15_Click, u"exit"_s);
+    addAnswers(*m_leave, leave, button(m_shown.Command4, Role::Main, &kyoskNew::Command4_Click));
+    connect(m_leave, &Overlay::escaped, &m_page, &kyoskNew::Command4_Click);
 }
 
 void kyoskNewView::makeHelpPanel() {
     m_help = new Overlay(theme(), this);
     m_help->setCardWidth(700);
-    m_help->column()->addWidget(label(u"Label9"_s, m_shown.Label9));
-    auto* close = button(u"helpClose"_s, m_shown.helpClose, Role::Main, [this] { m_page.Image6_Click(); });
+    m_help->column()->addWidget(label(m_shown.Label9));
+    auto* close = button(m_shown.helpClose, Role::Main, &kyoskNew::Image6_Click);
     m_help->column()->addWidget(close, 0, Qt::AlignTrailing);
     m_help->setFirstFocus(close);
-    connect(m_help, &Overlay::escaped, this, [this] { m_page.Image6_Click(); });
+    connect(m_help, &Overlay::escaped, &m_page, &kyoskNew::Image6_Click);
 }
 
 void kyoskNewView::makeClosingPanel() {
@@ -269,42 +253,32 @@ void kyoskNewView::makeClosingPanel() {
     column->setSpacing(theme().px(8));
     auto* top = new QHBoxLayout;
     top->setSpacing(theme().px(12));
-    top->addWidget(label(u"closingHead"_s, m_shown.closingHead, "title"), 1);
-    top->addWidget(button(
-        u"Image17"_s, m_shown.Image17, Role::Quiet, [this] { m_page.Image17_Click(); }, u"tag"_s));
+    top->addWidget(label(m_shown.closingHead, "title"), 1);
+    top->addWidget(button(m_shown.Image17, Role::Quiet, &kyoskNew::Image17_Click, u"tag"_s));
     column->addLayout(top);
 
     auto* facts = new QFrame(m_closing);
     setRole(facts, "well");
     auto* factRow = new QHBoxLayout(facts);
     factRow->setContentsMargins(theme().px(18), theme().px(8), theme().px(18), theme().px(8));
-    const auto fact = [&](const QString& promptName, const Caption& prompt, const QString& name, const Caption& value) {
-        auto* promptLabel = label(promptName, prompt, "muted");
-        auto* valueLabel = label(name, value, "title");
-        promptLabel->setWordWrap(false);
-        valueLabel->setWordWrap(false);
-        factRow->addWidget(promptLabel);
-        factRow->addWidget(valueLabel);
+    const auto fact = [&](const Caption& prompt, const Caption& value) {
+        factRow->addWidget(lineLabel(prompt, "muted"));
+        factRow->addWidget(lineLabel(value, "title"));
         factRow->addStretch(1);
     };
-    fact(u"Label20Prompt"_s, m_shown.Label20Prompt, u"Label20"_s, m_shown.Label20);
-    fact(u"Label19Prompt"_s, m_shown.Label19Prompt, u"Label19"_s, m_shown.Label19);
+    fact(m_shown.Label20Prompt, m_shown.Label20);
+    fact(m_shown.Label19Prompt, m_shown.Label19);
     column->addWidget(facts);
     auto* coupon = new QHBoxLayout;
     coupon->setSpacing(theme().px(8));
-    for (QLabel* part : {label(u"Label4kpn3Prompt"_s, m_shown.Label4kpn3Prompt, "muted"),
-                         label(u"Label4kpn3"_s, m_shown.Label4kpn3, "strong")}) {
-        part->setWordWrap(false);
-        coupon->addWidget(part);
-    }
+    coupon->addWidget(lineLabel(m_shown.Label4kpn3Prompt, "muted"));
+    coupon->addWidget(lineLabel(m_shown.Label4kpn3, "strong"));
     coupon->addStretch(1);
     column->addLayout(coupon);
 
     auto* mailLine = new QHBoxLayout;
-    mailLine->addWidget(label(u"Label17"_s, m_shown.Label17, "strong"));
-    auto* required = label(u"Label33"_s, m_shown.Label33, "danger");
-    required->setWordWrap(false);
-    mailLine->addWidget(required);
+    mailLine->addWidget(label(m_shown.Label17, "strong"));
+    mailLine->addWidget(lineLabel(m_shown.Label33, "danger"));
     mailLine->addStretch(1);
     column->addLayout(mailLine);
     // An address runs from left to right in both languages.
@@ -313,7 +287,7 @@ void kyoskNewView::makeClosingPanel() {
     auto* addressRow = new QHBoxLayout(address);
     addressRow->setContentsMargins(0, 0, 0, 0);
     addressRow->setSpacing(theme().px(8));
-    m_mail = field(u"Text1"_s, m_shown.Text1, [this](const QString& text) { m_page.Text1_Change(text); });
+    m_mail = field(m_shown.Text1, [this](const QString& text) { m_page.Text1_Change(text); });
     m_mail->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     addressRow->addWidget(m_mail, 3);
     m_at = makeLabel(address, "large");
@@ -322,45 +296,44 @@ void kyoskNewView::makeClosingPanel() {
     m_domain = new EditableCombo(
         address, [this](int row) { m_page.Combo1_Click(row); },
         [this](const QString& text) { m_page.Combo1_Change(text); });
-    bind(u"Combo1"_s, m_domain, m_shown.Combo1);
+    bind(m_domain, m_shown.Combo1);
     addressRow->addWidget(m_domain, 2);
-    m_albumMail = field(u"Txt4Ml2"_s, m_shown.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
+    m_albumMail = field(m_shown.Txt4Ml2, [this](const QString& text) { m_page.Txt4Ml2_Change(text); });
     addressRow->addWidget(m_albumMail, 5);
     column->addWidget(address);
 
     column->addSpacing(theme().px(6));
-    column->addWidget(label(u"Text2Prompt"_s, m_shown.Text2Prompt, "strong"));
-    m_note = field(u"Text2"_s, m_shown.Text2, [this](const QString& text) { m_page.Text2_Change(text); });
+    column->addWidget(label(m_shown.Text2Prompt, "strong"));
+    m_note = field(m_shown.Text2, [this](const QString& text) { m_page.Text2_Change(text); });
     column->addWidget(m_note);
-    column->addWidget(label(u"LblKoopon"_s, m_shown.LblKoopon, "smallMuted"));
+    column->addWidget(label(m_shown.LblKoopon, "smallMuted"));
     column->addSpacing(theme().px(6));
 
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().gap());
-    m_backToPictures = button(u"Command10"_s, m_shown.Command10, Role::Secondary, [this] { m_page.Command10_Click(); });
+    m_backToPictures = button(m_shown.Command10, Role::Secondary, &kyoskNew::Command10_Click);
     row->addWidget(m_backToPictures);
     row->addStretch(1);
-    m_withoutAddress = button(u"Command7"_s, m_shown.Command7, Role::Secondary, [this] { m_page.Command7_Click(); });
+    m_withoutAddress = button(m_shown.Command7, Role::Secondary, &kyoskNew::Command7_Click);
     row->addWidget(m_withoutAddress);
-    row->addWidget(button(u"Command8"_s, m_shown.Command8, Role::Main, [this] { m_page.Command8_Click(); }));
+    row->addWidget(button(m_shown.Command8, Role::Main, &kyoskNew::Command8_Click));
     column->addLayout(row);
     m_closing->setFirstFocus(m_mail);
-    connect(m_closing, &Overlay::escaped, this, [this] { m_page.Command10_Click(); });
+    connect(m_closing, &Overlay::escaped, &m_page, &kyoskNew::Command10_Click);
 }
 
 void kyoskNewView::makeBranchPanel() {
     m_branches = new Overlay(theme(), this);
     m_branches->setCardWidth(820);
-    m_branches->column()->addWidget(label(u"Pic4snifim"_s, m_shown.Pic4snifim, "title"));
+    m_branches->column()->addWidget(label(m_shown.Pic4snifim, "title"));
     auto* row = new QHBoxLayout;
     row->setSpacing(theme().px(20));
     auto* grid = new QGridLayout;
     grid->setSpacing(theme().px(8));
     for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
         const int branch = static_cast<int>(i);
-        auto* made = button(
-            u"Command4Snif(%1)"_s.arg(i), m_shown.Command4Snif[i], Role::Plain,
-            [this, branch] { m_page.Command4Snif_Click(branch); }, branch == 10 ? u"truck"_s : u"shop"_s);
+        auto* made = button(m_shown.Command4Snif[i], Role::Plain, &kyoskNew::Command4Snif_Click, branch,
+                            branch == 10 ? u"truck"_s : u"shop"_s);
         m_branchButtons[i] = made;
         grid->addWidget(made, branch / 2, branch % 2);
     }
@@ -368,15 +341,14 @@ void kyoskNewView::makeBranchPanel() {
     auto* card = new QFrame(m_branches);
     setRole(card, "notice");
     auto* cardColumn = new QVBoxLayout(card);
-    cardColumn->addWidget(label(u"Label41"_s, m_shown.Label41));
+    cardColumn->addWidget(label(m_shown.Label41));
     cardColumn->addStretch(1);
-    bind(u"Pic4Snif"_s, card, m_shown.Pic4Snif);
+    bind(card, m_shown.Pic4Snif);
     row->addWidget(card, 2);
     m_branches->column()->addLayout(row);
-    m_branches->column()->addWidget(
-        button(u"Command28"_s, m_shown.Command28, Role::Secondary, [this] { m_page.Command28_Click(); }), 0,
-        Qt::AlignLeading);
-    connect(m_branches, &Overlay::escaped, this, [this] { m_page.Command28_Click(); });
+    m_branches->column()->addWidget(button(m_shown.Command28, Role::Secondary, &kyoskNew::Command28_Click), 0,
+                                    Qt::AlignLeading);
+    connect(m_branches, &Overlay::escaped, &m_page, &kyoskNew::Command28_Click);
     // The card beside the buttons follows the mouse and the keyboard alike.
     connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {
         for (std::size_t i = 0; i < m_branchButtons.size(); ++i) {
@@ -400,42 +372,9 @@ bool kyoskNewView::eventFilter(QObject* watched, QEvent* event) {
 
 void kyoskNewView::makeCompressionPanel() {
     m_compression = new Overlay(theme(), this);
-    m_compression->column()->addWidget(label(u"Label37"_s, m_shown.Label37, "large"));
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme().gap());
-    row->addWidget(button(u"Command20"_s, m_shown.Command20, Role::Secondary, [this] { m_page.Command20_Click(); }));
-    row->addStretch(1);
-    auto* yes = button(u"Command21"_s, m_shown.Command21, Role::Main, [this] { m_page.Command21_Click(); });
-    row->addWidget(yes);
-    m_compression->column()->addLayout(row);
-    m_compression->setFirstFocus(yes);
-}
-
-void kyoskNewView::bindTheRest() {
-    const std::pair<const char*, const Caption*> captions[] = {{"Label1", &m_shown.Label1},
-                                                               {"Label2", &m_shown.Label2},
-                                                               {"Label18", &m_shown.Label18},
-                                                               {"Label24", &m_shown.Label24},
-                                                               {"Label34", &m_shown.Label34},
-                                                               {"Label34Prompt", &m_shown.Label34Prompt},
-                                                               {"Label36", &m_shown.Label36},
-                                                               {"Frame2", &m_shown.Frame2},
-                                                               {"Frame3", &m_shown.Frame3},
-                                                               {"Frame4", &m_shown.Frame4},
-                                                               {"Picture7", &m_shown.Picture7},
-                                                               {"PicB4Sioom", &m_shown.PicB4Sioom},
-                                                               {"Pic4Brose", &m_shown.Pic4Brose},
-                                                               {"Command11", &m_shown.Command11},
-                                                               {"Image19", &m_shown.Image19},
-                                                               {"Image20", &m_shown.Image20},
-                                                               {"Image23", &m_shown.Image23},
-                                                               {"Command26(0)", &m_shown.Command26[0]},
-                                                               {"Command26(1)", &m_shown.Command26[1]}};
-    for (const auto& [name, caption] : captions)
-        bindHidden(QString::fromLatin1(name), *caption);
-    bindList(u"List1"_s, m_shown.List1);
-    bindList(u"List2"_s, m_shown.List2);
-    bindList(u"List4"_s, m_shown.List4);
+    m_compression->column()->addWidget(label(m_shown.Label37, "large"));
+    auto* no = button(m_shown.Command20, Role::Secondary, &kyoskNew::Command20_Click);
+    addAnswers(*m_compression, no, button(m_shown.Command21, Role::Main, &kyoskNew::Command21_Click));
 }
 
 QWidget* kyoskNewView::firstFocus() const {

@@ -13,7 +13,7 @@ class EditableCombo;
 class LargePicture;
 class PictureCell;
 
-class kyoskNewView : public PageView {
+class kyoskNewView : public ViewOf<kyoskNew> {
     Q_OBJECT
 public:
     kyoskNewView(kyoskNew& page, const SessionState& state, const Theme& theme);
@@ -31,19 +31,19 @@ private:
     QWidget* makeEmpty();
     QWidget* makeSide();
     void makeBars();
+    // A row of two buttons; first has the keyboard when the panel opens.
+    void addAnswers(Overlay& panel, QPushButton* other, QPushButton* first);
     void makeLeavePanel();
     void makeClosingPanel();
     void makeBranchPanel();
     void makeCompressionPanel();
     void makeHelpPanel();
-    void bindTheRest();
     void renderFolder();
     void renderCells();
     void renderClosing();
     void fitCells();
     void takeFocus();
 
-    kyoskNew& m_page;
     const kyoskNewControls& m_shown;
     QStackedLayout* m_body = nullptr;
     std::array<PictureCell*, cellsOfPage> m_cells{};
