@@ -98,6 +98,8 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         EXPECT_EQ(shown.Picture7.visible, !each.closesAtOnce);
         page.Command14_Click();
         EXPECT_EQ(page.phase(), each.end);
+        if (each.closesAtOnce)
+            continue;
         page.Command28_Click();
         EXPECT_EQ(line.rig.chain.front()->id(), PageId::hatchala) << "every end leads to a new order";
         EXPECT_EQ(line.rig.chain.find(PageId::FtpFrm), nullptr);

@@ -30,13 +30,12 @@ void kyoskNew::checkAndClose() {
     Combo1.text = mailDomainPrompt(m_state.english());
     if (couponRefuses())
         return;
-    m_state.DchisaAmoka = 0; // an order before may have set it
-    if (plain()) {
-        const DeepCompression deep = deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa);
-        m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
-        Picture7.visible = deep == DeepCompression::Ask;
-    }
+    const DeepCompression deep =
+        plain() ? deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa) : DeepCompression::Off;
+    m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
     openClosingPanel();
+    // The question lies over the closing panel, and so comes behind it.
+    Picture7.visible = PicB4Sioom.visible && deep == DeepCompression::Ask;
 }
 
 bool kyoskNew::couponRefuses() {
