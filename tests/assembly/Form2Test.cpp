@@ -127,7 +127,8 @@ TEST_F(PreparingAPlainOrder, takesNoSecondPressAndNoRemovalWhileItPrepares) {
     Form2& page = openWith({line(givePicture(u"one.jpg"_s)), line(givePicture(u"two.jpg"_s))});
     bool enabledMeanwhile = false;
     machine.pump.onPump = [&] {
-        enabledMeanwhile = enabledMeanwhile || page.controls().Command1.enabled || page.controls().Command3.enabled || page.controls().Command6.enabled;
+        enabledMeanwhile = enabledMeanwhile || page.controls().Command1.enabled || page.controls().Command3.enabled ||
+                           page.controls().Command6.enabled;
         page.Command3_Click();
         page.Command6_Click();
         page.Command1_Click();
@@ -239,9 +240,11 @@ TEST_F(PreparingAPlainOrder, saysItsTextsInTheLanguageOfTheSession) {
     EXPECT_EQ(page.controls().Label10.text, u"אל תמחק אותם עד אשר תקבל את התמונות מודפסות"_s);
     state.EnglishTips = 1;
     page.setTexts();
-    for (const Caption* caption : {&page.controls().Label1, &page.controls().Label4Progress, &page.controls().Label4fail, &page.controls().Label4removed,
-                                   &page.controls().Label6, &page.controls().Label10, &page.controls().Command1, &page.controls().Command3, &page.controls().Command4,
-                                   &page.controls().Command5, &page.controls().Command6, &page.controls().Command7, &page.controls().Command8, &page.controls().Picture5}) {
+    for (const Caption* caption :
+         {&page.controls().Label1, &page.controls().Label4Progress, &page.controls().Label4fail,
+          &page.controls().Label4removed, &page.controls().Label6, &page.controls().Label10, &page.controls().Command1,
+          &page.controls().Command3, &page.controls().Command4, &page.controls().Command5, &page.controls().Command6,
+          &page.controls().Command7, &page.controls().Command8, &page.controls().Picture5}) {
         EXPECT_FALSE(caption->text.isEmpty());
         for (const QChar letter : caption->text)
             EXPECT_NE(letter.script(), QChar::Script_Hebrew) << caption->text.toStdString();
