@@ -78,7 +78,7 @@ public:
     void Command3_Click() { checkAndClose(); }
     void Command4Snif_Click(int branch) { chooseBranch(branch); }
     void Command4Snif_MouseMove(int branch) { showBranch(branch); } // also when it takes the focus
-    void Image33_Click() { openBranches(); }
+    void Image33_Click() { offerBranches(); }
     void Command28_Click() { closeBranches(); }
     void Command20_Click() { setDeepCompression(false); }
     void Command21_Click() { setDeepCompression(true); }
@@ -169,6 +169,7 @@ private:
     void openClosingPanel();
     void closeFinish();
     void openBranches();
+    void offerBranches();
     void chooseBranch(int branch);
     void showBranch(int branch);
     void closeBranches();

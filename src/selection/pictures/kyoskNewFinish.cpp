@@ -85,6 +85,7 @@ void kyoskNew::setDeepCompression(bool deep) {
     Q_EMIT changed();
 }
 
+// The panel lies over the closing panel: a view hears of it when both are open.
 void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
@@ -95,6 +96,10 @@ void kyoskNew::openBranches() {
     // A lab with fewer shops leaves captions empty.
     for (Caption& branch : Command4Snif)
         branch.visible = !branch.text.isEmpty();
+}
+
+void kyoskNew::offerBranches() {
+    openBranches();
     Q_EMIT changed();
 }
 
