@@ -191,9 +191,10 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
         const double u = startU + stepU * (from + 0.5);
         const double v = startV + stepV * (from + 0.5);
         // Half a phase of the sampler's weights, which cut the position.
-        const double half = 1.0 / 512.0;
-        const SampleLine line{fixed(u * scaleX - 0.5 - corner.x() + half), fixed(v * scaleY - 0.5 - corner.y() + half),
-                              fixed(stepU * scaleX), fixed(stepV * scaleY)};
+        const double halfPhase = 1.0 / 512.0;
+        const SampleLine line{fixed(u * scaleX - 0.5 - corner.x() + halfPhase),
+                              fixed(v * scaleY - 0.5 - corner.y() + halfPhase), fixed(stepU * scaleX),
+                              fixed(stepV * scaleY)};
         const auto lineAt = [&](int x) {
             return SampleLine{line.x + (x - from) * line.stepX, line.y + (x - from) * line.stepY, line.stepX,
                               line.stepY};

@@ -52,12 +52,13 @@ struct Needed {
 };
 
 void checkFilled(IniReader& reader, const Needed& needed) {
-    for (const auto& [name, value] : needed.filled) {
+    for (const auto& filled : needed.filled) {
+        const auto& [name, value] = filled;
         const QString fullName = IniReader::fullName(needed.section, name);
         if (!value.isEmpty() || !reader.errors().filter(fullName).isEmpty()) // a wrong value is told already
             continue;
         const auto key = std::find_if(labKeys().begin(), labKeys().end(), [&](const LabKey& known) {
-            return known.section == needed.section && known.name == name;
+            return known.section == needed.section && known.name == filled.first;
         });
         reader.fail(reader.lineOf(needed.chosen),
                     u"%1 is %2, and %3 is empty; allowed with it: %4"_s.arg(
