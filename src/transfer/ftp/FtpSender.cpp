@@ -18,13 +18,11 @@ private:
     }
 
     std::optional<SendingPhase> checkArrival(int attempt) override {
-        FtpLists& lists = m_sender.lists;
-        UploadCheck& check = m_sender.check;
         m_sender.session.PauseBar();
         if (attempt == 1) {
-            if (lists.List3.count() < lists.List4Makor.count())
+            if (m_sender.lists.List3.count() < m_sender.lists.List4Makor.count())
                 m_sender.refill();
-            if (lists.List3.isEmpty()) {
+            if (m_sender.lists.List3.isEmpty()) {
                 m_events.reached(SendingMoment::NothingToSend);
                 return SendingPhase::NoOrder;
             }
@@ -32,31 +30,30 @@ private:
         compare(attempt);
         const bool arrived = m_sender.allCounted();
         // A stop cuts the check short; what it still saw itself counts.
-        if (m_stop.StopFlag && !(arrived && check.freshCount)) {
+        if (m_stop.StopFlag && !(arrived && m_sender.check.freshCount)) {
             if (!m_stop.left)
                 m_sender.pass.endStopped();
             return SendingPhase::Stopped;
         }
         if (arrived)
             return SendingPhase::Success;
-        if (check.NumOnServer > m_sender.NumToSend)
+        if (m_sender.check.NumOnServer > m_sender.NumToSend)
             return std::nullopt;
-        if (lists.List3.isEmpty())
+        if (m_sender.lists.List3.isEmpty())
             return m_sender.silentEnd();
-        m_events.reached(SendingMoment::Incomplete, static_cast<int>(check.missing().size()));
+        m_events.reached(SendingMoment::Incomplete, static_cast<int>(m_sender.check.missing().size()));
         return std::nullopt;
     }
 
     // Afterwards List3 holds what is missing, unless the server holds too many names.
     void compare(int attempt) {
-        UploadCheck& check = m_sender.check;
-        check.check(attempt);
-        if (check.NumOnServer >= m_sender.NumToSend || m_stop.left)
+        m_sender.check.check(attempt);
+        if (m_sender.check.NumOnServer >= m_sender.NumToSend || m_stop.left)
             return;
         // A second look, since the first may have failed and counted an older listing.
-        check.ListServerFiles();
-        if (check.NumOnServer < m_sender.NumToSend)
-            check.RebuildMissing();
+        m_sender.check.ListServerFiles();
+        if (m_sender.check.NumOnServer < m_sender.NumToSend)
+            m_sender.check.RebuildMissing();
     }
 
     SendingPhase afterTheLast() override {
@@ -77,8 +74,7 @@ private:
 
     bool sendMissing(int) override {
         m_stop.StopFlag = false;
-        const FtpSession& session = m_sender.session;
-        for (int i = 0; i < m_sender.lists.List3.count() && session.ConnectFails <= mostConnectFails; ++i) {
+        for (int i = 0; i < m_sender.lists.List3.count() && m_sender.session.ConnectFails <= mostConnectFails; ++i) {
             if (m_stop.StopFlag || m_stop.left)
                 break;
             m_sender.pass.UploadOneFile(i);
@@ -87,13 +83,12 @@ private:
     }
 
     std::optional<SendingPhase> checkArrival(int round) override {
-        UploadCheck& check = m_sender.check;
-        check.ListServerFiles();
-        if (m_sender.allCounted() && (check.freshCount || !m_stop.StopFlag))
+        m_sender.check.ListServerFiles();
+        if (m_sender.allCounted() && (m_sender.check.freshCount || !m_stop.StopFlag))
             return SendingPhase::Success;
         if (stopped())
             return SendingPhase::Stopped;
-        if (check.NumOnServer < m_sender.NumToSend) {
+        if (m_sender.check.NumOnServer < m_sender.NumToSend) {
             m_sender.session.RoundNo = HoldIn16Bits(round);
             m_events.reached(SendingMoment::RoundFailed, round);
             m_anyFailed = true;
@@ -116,7 +111,7 @@ private:
 FtpSender::FtpSender(const ClientProfile& profile, TransferState& transfer, const Platform& platform,
                      SendingEvents& events)
     : session(profile, transfer, platform, events, stop, lists)
-    , pass(transfer, platform, events, stop, lists, session)
+    , pass(platform, events, stop, lists, session)
     , check(transfer, platform.pump, events, stop, lists, session)
     , m_events(events) {}
 

@@ -9,10 +9,8 @@ namespace lumora {
 // One walk over List3: each file on a session of its own, names that are on the server already skipped.
 class UploadPass {
 public:
-    UploadPass(const TransferState& transfer, const Platform& platform, SendingEvents& events, SendingStop& stop,
-               FtpLists& lists, FtpSession& session)
-        : m_transfer(transfer)
-        , m_platform(platform)
+    UploadPass(const Platform& platform, SendingEvents& events, SendingStop& stop, FtpLists& lists, FtpSession& session)
+        : m_platform(platform)
         , m_events(events)
         , m_stop(stop)
         , m_lists(lists)
@@ -36,7 +34,6 @@ private:
     void put(const QString& path, const QString& name);
     void closeWithPauses();
 
-    const TransferState& m_transfer;
     const Platform& m_platform;
     SendingEvents& m_events;
     SendingStop& m_stop;
