@@ -173,22 +173,22 @@ QWidget* mikledetView::makeKeys() {
     auto* grid = new QGridLayout(box);
     grid->setContentsMargins(0, 0, 0, 0);
     grid->setSpacing(theme().px(6));
-    constexpr int columns = KeyLayout::columns;
+    constexpr int keyColumns = KeyLayout::columns;
     const auto places = KeyLayout::places();
     for (int at = 0; at < KeyLayout::letterKeys; ++at)
-        grid->addWidget(key(places[static_cast<std::size_t>(at)]), at / columns, at % columns);
+        grid->addWidget(key(places[static_cast<std::size_t>(at)]), at / keyColumns, at % keyColumns);
 
     auto* back = toKey(button(
         u"Command3"_s, m_shows.Command3, Role::Plain, [&page] { page.Command3_Click(); }, u"backspace"_s));
-    grid->addWidget(back, 0, columns);
+    grid->addWidget(back, 0, keyColumns);
     auto* enter = toKey(button(
         u"Command7"_s, m_shows.Command7, Role::Quiet, [&page] { page.Command7_Click(); }, u"enter"_s));
     enter->setMaximumHeight(QWIDGETSIZE_MAX);
     enter->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
-    grid->addWidget(enter, 1, columns, 2, 1);
+    grid->addWidget(enter, 1, keyColumns, 2, 1);
 
     // As on a telephone.
-    constexpr int digits = columns + 2;
+    constexpr int digits = keyColumns + 2;
     for (int digit = 1; digit <= 9; ++digit)
         grid->addWidget(key(KeyLayout::firstDigit + digit), (digit - 1) / 3, digits + (digit - 1) % 3);
     grid->addWidget(key(KeyLayout::firstDigit), 3, digits, 1, 3);
@@ -210,10 +210,10 @@ QWidget* mikledetView::makeKeys() {
     auto* clear = toKey(button(u"Command6"_s, m_shows.Command6, Role::Quiet, [&page] { page.Command6_Click(); }));
     grid->addWidget(clear, 3, 8, 1, 3);
 
-    for (int i = 0; i < columns; ++i)
+    for (int i = 0; i < keyColumns; ++i)
         grid->setColumnStretch(i, 10);
-    grid->setColumnStretch(columns, 14);
-    grid->setColumnMinimumWidth(columns + 1, theme().px(8));
+    grid->setColumnStretch(keyColumns, 14);
+    grid->setColumnMinimumWidth(keyColumns + 1, theme().px(8));
     for (int i = 0; i < 3; ++i)
         grid->setColumnStretch(digits + i, 10);
     return box;
