@@ -76,6 +76,7 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         EXPECT_EQ(shown.AllDone, success ? 1 : 0);
         EXPECT_EQ(shown.Label3.text, each.status);
         EXPECT_EQ(shown.Label34.text, each.attempt);
+        EXPECT_EQ(shown.Label34.visible, !hasArrived(each.end));
         EXPECT_EQ(shown.Picture6.visible, each.end == SendingPhase::NotAll);
         EXPECT_EQ(shown.Picture2.visible, success);
         EXPECT_EQ(shown.Command10.visible, !hasArrived(each.end));

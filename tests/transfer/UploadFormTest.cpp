@@ -208,12 +208,12 @@ TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
 
 TEST_F(UploadFormTest, SaysWhenThereIsNothingToSendOrNobodyToSendTo) {
     rig.state.profile.HttpHost.clear();
-    EXPECT_EQ(rig.start().look().sign, SendingSign::Bad);
-    EXPECT_FALSE(rig.page().counting());
+    EXPECT_EQ(rig.start().phase(), SendingPhase::NoServer);
+    EXPECT_FALSE(rig.page().counting() || rig.page().controls().Pic4Failure.visible);
     FakeWebLab other;
     UploadFormRig empty(other);
     empty.state.transfer.OrderFolder = u"C:\\"_s;
-    EXPECT_EQ(empty.start().look().sign, SendingSign::Bad);
+    EXPECT_EQ(empty.start().phase(), SendingPhase::NoOrder);
     EXPECT_TRUE(lab.urls.isEmpty() && other.urls.isEmpty());
 }
 

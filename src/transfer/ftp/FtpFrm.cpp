@@ -201,7 +201,6 @@ void FtpFrm::succeed() {
     PicInProgWidth = Pic4ProgWidth;
     LabelProg.text = QStringLiteral("100  %");
     Picture7.visible = false; // its warning no longer holds
-    Label34.visible = false;
 }
 
 void FtpFrm::finish(SendingPhase end) {
@@ -209,6 +208,7 @@ void FtpFrm::finish(SendingPhase end) {
         succeed();
     pageSize = PageSize::Full;
     Label4File.text.clear();
+    Label34.visible = !hasArrived(end); // nothing is missing, in whichever attempt it came
     Picture1.visible = false;
     File1Enabled.enabled = end != SendingPhase::Success;
     if (end == SendingPhase::NotAll) {
