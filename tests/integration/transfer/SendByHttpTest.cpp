@@ -171,7 +171,7 @@ TEST_F(SendByHttp, TheTestFormAnnouncesMoreThanItsBodyAndIsTaken) {
 }
 
 // The address sanitizer's allocator holds on to what was freed, so that there the peak tells nothing.
-#ifndef __SANITIZE_ADDRESS__
+#ifndef LUMORA_SANITIZED
 
 // Peak memory of this process, in bytes.
 qint64 peakMemory() {
