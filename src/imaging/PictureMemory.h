@@ -2,8 +2,8 @@
 
 namespace lumora {
 
-// For main(): keeps the memory of a picture for the next one. Given back to the system after each, as the library would
-// do, it comes back page by page, which takes as long as a sixth of an edited print.
+// Called once by main(): the process keeps the memory of a freed picture for the next one. With glibc's defaults it
+// goes back to the system and returns page by page, which takes a sixth of the time of an edited print.
 void keepPictureMemory();
 
 } // namespace lumora

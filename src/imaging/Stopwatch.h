@@ -6,7 +6,7 @@
 
 namespace lumora {
 
-// Adds the time since the last call to one stage; does nothing where nobody asked for times.
+// Adds the milliseconds since the last call to one stage of times; does nothing when times is null.
 class Stopwatch {
 public:
     explicit Stopwatch(PictureTimes* times)

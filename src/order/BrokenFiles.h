@@ -11,13 +11,13 @@ class Files;
 class OrderFolder;
 class TextList;
 
-// kashloo.txt in the local order folder: the files whose put failed, one full local path a line. It outlives the
-// program, so that what a broken put left on the server is not taken for a sent file when the order is sent again.
+// Writes kashloo.txt into the local order folder: the files whose put failed, one full local path a line. A later run
+// of the program reads it when the order is sent again, so that the incomplete file on the server does not count as
+// sent.
 Result<void> WriteBrokenFiles(const Files& files, const OrderFolder& folder, const TextList& broken);
-// Empty when there is no such file.
+// The paths of kashloo.txt; empty when there is no such file or it can't be read.
 QStringList ReadBrokenFiles(const Files& files, const OrderFolder& folder);
 
-// True if one of the paths has this leaf name.
 bool IsBroken(const TextList& broken, const QString& leafName);
 
 } // namespace lumora

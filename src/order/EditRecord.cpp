@@ -44,7 +44,7 @@ QString frameOfBorder(const QString& paperBorderCode) {
 
 namespace {
 
-// A digit comes first, a sign and a point at most before it.
+// True when the field has a digit behind at most a sign, blanks and a point.
 bool beginsWithNumber(const QString& field) {
     static const QRegularExpression number(QStringLiteral("^[+-]? *\\.?[0-9]"));
     return number.match(field).hasMatch();
@@ -58,8 +58,8 @@ void UnpackEditState(const QString& record, EditFields& fields) {
     const auto text = [&](R::Column column) { return fields.EditState.mid(column.position - 1, column.width); };
     const auto number = [&](R::Column column) { return Val16(text(column)); };
 
-    // Where a damaged record has letters for a number the picture stays without that edit: read as 0 they would print
-    // it black, or shrunk to nothing.
+    // Without the edit when a damaged record has letters in place of a number: 0 would print the picture black or
+    // shrunk to nothing.
     const auto unlessLetters = [&](R::Column column, double without) {
         const QString field = text(column).trimmed();
         return field.isEmpty() || beginsWithNumber(field) ? Val(field) : without;
@@ -111,7 +111,7 @@ void PackEditState(EditFields& fields, const QString& paperBorderCode, const QSt
         record.replace(column.position - 1, column.width, LeftField(value, column.width));
     };
     const auto number = [&](R::Column column, int value) { text(column, QString::number(value)); };
-    // No page sets these; what came with the record goes on with it.
+    // No page sets these fields; the values of the record are kept.
     const auto carried = [&](R::Column column) {
         number(column, Val16(before.mid(column.position - 1, column.width)));
     };

@@ -8,13 +8,13 @@ namespace lumora {
 
 struct EditFields;
 
-// The edit record of a picture: 200 characters, fields by position, left-justified and blank-filled. The basket carries
-// it and both the editor and the preparation read it.
+// The edit record of a picture: 200 characters, fields by position, left-justified and filled with blanks. A basket
+// line holds it; the editor and the preparation of the order read it.
 namespace EditRecord {
 
 inline constexpr int width = 200;
 
-// A field by its first character (from 1) and its width.
+// A field: its first character (counted from 1) and its width.
 struct Column {
     int position;
     int width;
@@ -51,53 +51,53 @@ inline constexpr Column TextStyle{95, 2};
 inline constexpr Column TextFont{97, 30};
 inline constexpr Column TextBody{127, 70};
 
-// What the fields hold where they are set. RedMarker: the picture is taken from its corrected copy; AutoMarker: the
-// automatic level step was asked for; in both, notMarked else.
+// Field values. RedMarker is corrected when the picture is read from its corrected copy; AutoMarker is levelled when
+// the automatic level step was asked for; both are notMarked otherwise.
 inline const QString corrected = QStringLiteral("RED");
 inline const QString levelled = QStringLiteral("111");
 inline const QString notMarked = QStringLiteral("000");
-inline const QString noFrame = QStringLiteral("000");      // FrameName of a picture that never had one,
-inline const QString frameRemoved = QStringLiteral("999"); // and of one that lost it
-inline constexpr std::int16_t alignCentre = 1;             // TextAlign; 0: the text begins at its point
+inline const QString noFrame = QStringLiteral("000");      // FrameName of a picture that never had a frame
+inline const QString frameRemoved = QStringLiteral("999"); // FrameName of a picture whose frame was removed
+inline constexpr std::int16_t alignCentre = 1;             // TextAlign; with 0 the text begins at its point
 inline constexpr std::int16_t alignFar = 2;
-inline constexpr std::int16_t runsDown = 3; // TextVertical; every other value: across
+inline constexpr std::int16_t runsDown = 3; // TextVertical; with any other value the text runs across
 
-// The frame that a border of the order stands for, "WB" or "BK"; noFrame for any other.
+// The frame that a border of the order stands for: "001" for "WB", "002" for "BK", noFrame for any other border.
 QString frameOfBorder(const QString& paperBorderCode);
 
-// What a field becomes in its column: the right end of what is too long is cut, and of a text the blanks around it are
-// not part, while a line break at its beginning is.
+// The value that is read back after the field was stored: the right end of a long value is cut. A text also loses the
+// blanks around it, but keeps a leading line break.
 std::int16_t stored(Column column, std::int16_t number);
 QString stored(Column column, const QString& text);
 
-// The record of a picture that was not edited.
+// The record of a picture without edits.
 QString newPicture();
 
-// What the record holds before any picture is chosen: the three gains alone.
+// The record before any picture is chosen: the three gains alone.
 QString beforeAnyPicture();
 
 } // namespace EditRecord
 
-// Splits a record into the fields of a picture; PicturePath and TempRedName stay. Numbers stop at the first character
-// that is no part of one, so that blanks, "000" and "0  " all read as 0; a font size below 8 becomes 8.
+// Reads the fields of a picture from its record; PicturePath and TempRedName stay. A number ends at the first character
+// that can't belong to it, so that blanks, "000" and "0  " all give 0. A font size below 8 becomes 8.
 void UnpackEditState(const QString& record, EditFields& fields);
 
-// Writes the fields into EditState. The border "WB" or "BK" of the order becomes frame "001" or "002" of a picture that
-// has none ("000"; one whose frame was removed, "999", stays without), and takes frameFolder where the record names
-// no folder. A field that is too long loses its right end without a word: a gain keeps its first four characters.
+// Writes the fields into EditState. With the order's border "WB" or "BK" a picture without a frame ("000", not "999")
+// gets the frame "001" or "002", from frameFolder if the picture names no folder. A long value loses its right end
+// without an error: a gain keeps its first four characters.
 void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder);
 
-// The steps of the editor's buttons. What leaves 16 bits is held at the limit.
+// The steps of the editor's buttons. Results are held within 16 bits.
 namespace EditStep {
 
-// A gain and so many hundredths, in double precision, kept as a single.
+// from plus hundredths / 100, computed in double precision and rounded to single.
 float gain(float from, int hundredths);
 
-// Held within 40 to 210.
+// from plus step, held within 40 to 210 per cent.
 std::int16_t zoom(std::int16_t from, int step);
 
-// Over 540 the turn starts again at 180; downwards there is no limit. The quarter turns have their own range, and the
-// two do not agree.
+// A turn in steps: above 540 it starts again at 180, downwards there is no limit. The quarter turns below hold their
+// results within 180 to 540 instead.
 std::int16_t turn(std::int16_t from, int step);
 std::int16_t quarterRight(std::int16_t from);
 std::int16_t quarterLeft(std::int16_t from);

@@ -7,13 +7,13 @@
 
 namespace lumora {
 
-// A finished order by the name of its folder, YYYY_MM_DD_SSS_ssss^NNN and a "P" where it travels in pieces.
+// A finished order as the name of its folder tells it: YYYY_MM_DD_SSS_ssss^NNN, then "P" if the order is in pieces.
 struct FinishedOrder {
     QDate date;
     QString number;
     bool pieces = false;
 };
-// No value for a folder with a name of another kind.
+// No value when the folder's name has another form.
 std::optional<FinishedOrder> FinishedOrderOf(const QString& folderName);
 
 } // namespace lumora

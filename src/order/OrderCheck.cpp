@@ -19,7 +19,7 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-// The tail that the print files of an order should carry.
+// The tail that the log's order gives its print files.
 OrderTail tailOf(const OrderLog& log) {
     return {log.shemot.n2,
             log.shemot.n1,
@@ -80,7 +80,7 @@ private:
                       .arg(m_log.failed.size()));
     }
 
-    // An edited order may have its sheet under a plain ending, instead or beside.
+    // The sheet of an edited order may end in .jpg, instead of .jpp or besides it.
     void checkSheet() {
         const auto named = [this](const QString& ending) {
             return SheetName(m_tail.orderNumber, m_tail.serial, ending);
@@ -123,8 +123,8 @@ private:
     void checkTail(const QString& name, const QByteArray& bytes) {
         const std::optional<OrderTail> tail = OrderTail::parse(bytes);
         if (!tail)
-            return; // a print file may go without
-        // An album's log holds no customer.
+            return; // a print file may have no tail
+        // The log of an album names no customer.
         const bool customerKnown = m_log.Optint != OrderKind::Album;
         const auto compare = [&](const char* what, const QString& found, const QString& logged, int width) {
             QString wanted = LeftField(logged, width);
@@ -149,7 +149,7 @@ private:
             fault(QStringLiteral("%1: not the name of a print file").arg(name));
             return;
         }
-        // The place in the order has four digits only, so that several lines may be meant.
+        // The name holds only the last four digits of the line's number, so each line 10000 further on is tried too.
         bool found = false;
         for (qsizetype i = parts->index; i < m_log.items.size() && !found; i += 10000) {
             const BasketLine item = m_log.line(i);

@@ -9,25 +9,25 @@
 
 namespace lumora {
 
-// What an order folder holds, read as the lab reads it: from the files alone.
+// What was found in an order folder, read from its files alone as the lab reads it.
 struct OrderFindings {
-    QString order;      // name of the order in its log
-    int items = 0;      // lines of the basket
+    QString order;      // order name from the log
+    int items = 0;      // basket lines
     int prints = 0;     // print files that unpack to a whole picture
-    int failed = 0;     // pictures that the log names as failed
-    int copies = 0;     // of all lines
-    QStringList faults; // what does not hold together, one sentence each; empty when all is well
+    int failed = 0;     // pictures that the log reports as failed
+    int copies = 0;     // sum over all basket lines
+    QStringList faults; // one sentence for each contradiction; empty when there is none
 };
 
-// Checks that every print file unpacks to a whole JPEG, that names, tails and total agree with the log, that each line
-// of the basket has its print file or is named as failed, and that the order sheet is there. Fails when the folder or
-// its log can't be read at all.
+// Checks that every print file unpacks to a whole JPEG picture, that names, tails and total agree with the log, that
+// each basket line has a print file or is reported as failed, and that the order sheet is there. Fails when the folder
+// or its log can't be read.
 Result<OrderFindings> checkOrderFolder(const std::filesystem::path& folder, PrintFileShape shape);
 
-// Whether the bytes are one whole JPEG picture.
+// Fails unless the bytes are one whole JPEG picture.
 Result<void> checkWholeJpeg(const QByteArray& bytes);
 
-// The bytes of a file of this machine.
+// The bytes of a file on this machine. The failure tells a missing file from one that may not be read.
 Result<QByteArray> readHostFile(const std::filesystem::path& path);
 
 } // namespace lumora

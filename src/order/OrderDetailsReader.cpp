@@ -18,7 +18,7 @@ void setAll(OrderDetails& details, const QString& text) {
     details.TotalPics = 0;
 }
 
-// The log with what it tells of a customer taken over. An album tells nothing under these keys.
+// Reads the log and copies the customer's fields into details, except from an album's log, which lacks them.
 std::optional<OrderLog> readLog(const Files& files, const QString& path, OrderDetails& details) {
     const auto bytes = files.fileExists(path) ? files.read(path) : Failure{Failure::Kind::NotFound, path};
     if (!bytes) {

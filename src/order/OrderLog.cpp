@@ -14,8 +14,8 @@ namespace {
 
 using Layout = OrderLog::Layout;
 
-// A line's key and where its value stands in the log: a text, an integer, an integer that is written as a text, a date,
-// or a text that is the same in every log.
+// A log line: its key, and the field with its value. Quoted is an integer written as a text, Fixed a text that is the
+// same in every log.
 struct Quoted {
     std::int16_t* number;
 };
@@ -36,7 +36,7 @@ const QString basketLine = QStringLiteral("Shoora");
 const Line zeros{QStringLiteral("00"), Fixed{QStringLiteral("00")}};
 const Line stars{QStringLiteral("***"), Fixed{QString(45, u'*')}};
 
-// Nothing sets these three; the lab's reader expects their lines.
+// No page sets these three; the lab's reader expects their lines.
 Lines serverLines(OrderLog& log, const QString& sign) {
     return {{QStringLiteral("KeSherLaSharat") + sign, Quoted{&log.KeSherLaSharat}},
             {QStringLiteral("HitKasherDerech") + sign, &log.HitKasherDerech},
@@ -59,7 +59,7 @@ Lines detailLines(OrderDetails& shemot) {
             {QStringLiteral("Shemot.maat"), &shemot.maat},     {QStringLiteral("Shemot.FillFit"), &shemot.FillFit}};
 }
 
-// The extras are numbered from 1 here, from 0 in the session's lists: the last place of each list never travels.
+// The keys count the extras from 1, the session's lists from 0; the last item of each list is not written.
 Lines albumLines(OrderLog& log) {
     AlbumDetails& album = log.album;
     Lines lines = {
@@ -75,9 +75,9 @@ Lines albumLines(OrderLog& log) {
     return lines;
 }
 
-// All lines above the failed pictures, in the order in which a log has them.
+// The lines above the failed pictures, in the order of the log.
 Lines headLines(OrderLog& log, Layout layout) {
-    // The lab's reader of an edited order knows no other kind than 5.
+    // The lab's reader of an edited order accepts only the kind 5.
     if (layout == Layout::Edited)
         return serverLines(log, QStringLiteral(" = ")) + Lines{zeros} + nameLines(log, QStringLiteral("Shemot.")) +
                Lines{{QStringLiteral("Option"), Fixed{QStringLiteral("5")}}} + detailLines(log.shemot) + Lines{stars};
@@ -160,7 +160,7 @@ OrderLog OrderLog::of(const SessionState& state, Layout layout, const QStringLis
 
 QByteArray OrderLog::write() const {
     ListOutput output;
-    OrderLog log = *this; // the lines lead to fields that may be changed
+    OrderLog log = *this; // the lines point to mutable fields
     for (const Line& line : headLines(log, layout)) {
         output.text(line.key);
         std::visit(Writer{output}, line.value);

@@ -2,18 +2,18 @@
 
 #include <QString>
 
-// Names in and of an order's folder, by which the lab tells what is what.
+// Names of an order and of the files in its folder, as the lab's tools expect them.
 namespace lumora {
 
-// An order's name: TimeOfJob, which ends in "^", and the order number. The number alone is read back from a name.
+// The order name: TimeOfJob, which ends in "^", then the order number. OrderNumberOf gives the number of an order name.
 QString OrderName(const QString& TimeOfJob, const QString& number);
 QString OrderNumberOf(const QString& name);
 
-// The order sheet: its leaf name begins with "!". ending with its dot: ".jpp", or ".jpg" for who takes a plain picture.
+// The leaf name of the order sheet, "!number_serial" and ending: ".jpp", or ".jpg" for the copy that is no print file.
 QString SheetName(const QString& number, const QString& serial, const QString& ending);
 bool IsSheet(const QString& leaf);
 
-// An order in pieces: the last letter of its folder's path or leaf name is "P".
+// True when the folder's path or leaf name ends in "P": the order is sent in pieces.
 bool TravelsInPieces(const QString& folder);
 
 } // namespace lumora

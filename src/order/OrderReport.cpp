@@ -11,7 +11,7 @@ bool isReported(const TransferState& transfer) {
     return transfer.SugMishloah == Sending::NewOrder || transfer.SugMishloah == Sending::Resend;
 }
 
-// A line break inside a value would end the request line.
+// A line break inside a value would end the HTTP request line.
 QString onOneLine(QString value) {
     for (QChar& letter : value) {
         if (letter == u'\r' || letter == u'\n' || letter == QChar(u'\0'))

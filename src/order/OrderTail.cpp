@@ -7,7 +7,7 @@
 namespace lumora {
 namespace {
 
-// Squeezed before it is cut, so that the width counts bytes too.
+// The text is converted to the code page before it is cut, so that width counts bytes.
 QByteArray field(const QString& text, int width) {
     return AnsiCodePage::encode(LeftField(AnsiCodePage::squeeze(text), width));
 }
@@ -20,7 +20,7 @@ OrderTail OrderTail::of(const SessionState& state) {
 }
 
 QByteArray OrderTail::shortForm() const {
-    // The two leading ones once told the piece of a split print and the number of pieces.
+    // The first two fields once held the number of a split print's piece and the count of pieces; both are always 1.
     return field(QStringLiteral("1"), 2) + field(QStringLiteral("1"), 2) + field(telephone, 10) + field(name, 10) +
            field(totalPics, 3) + field(orderNumber, 3) + field(serial, 4) + field({}, 6);
 }

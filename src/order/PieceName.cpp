@@ -7,7 +7,7 @@ namespace lumora {
 namespace {
 
 constexpr int tailLength = 12;
-constexpr int endingLength = 4; // as of "a.jpp"; in a stem the "." is a "_"
+constexpr int endingLength = 4; // as in "a.jpp"; in a stem "_" stands for the "."
 
 QString without(const QString& text, int last) {
     return text.left(std::max<qsizetype>(text.size() - last, 0));

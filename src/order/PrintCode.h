@@ -13,40 +13,39 @@ namespace lumora {
 struct OrderDetails;
 
 // The print code, nine characters: copies (2), size code (4), paper letter (1), border code (2). A basket line and the
-// name of a print file begin with it, and all later stages cut it by position.
+// name of a print file begin with it; all readers cut it by position.
 struct PrintCode {
     static constexpr int width = 9;
     static constexpr int copiesWidth = 2;
     static constexpr int mostCopies = 99;
 
     int copies = 0;
-    QString size;       // "1015"; blank for a special size
+    QString size;       // "1015"; for a special size the customer's own code
     QChar paper = u' '; // "M" matte, "G" glossy
-    QString border;     // cut to two characters in the code: "WBX" becomes "WB"
+    QString border;     // only its first two characters get into the code: "WBX" becomes "WB"
 
     QString compose() const;
-    // From the first two characters of a line; what is no number counts as no copies.
+    // The copies of a basket line or print file's name; 0 when the first two characters are no number.
     static int copiesOf(const QString& line);
-    // The two characters of the copies.
+    // The copies as two characters.
     static QString copiesField(int copies) { return LeftField(QString::number(copies), copiesWidth); }
 };
 
-// What has the copies in its first two characters. A name that no order gave may hold a part of a copy, which does not
-// count.
+// Which texts begin with the copies. A file name that no order made may begin with a fraction, which is rounded down.
 enum class CopiesIn { BasketLines, FileNames };
 
-// The copies of all texts but those that end in "txt", held at 32767. The order sheet, whose name begins with "!", and
-// names that begin with letters add 0.
+// The copies of all texts but those that end in "txt", held at 32767. The order sheet and names that begin with a
+// letter count 0.
 std::int16_t sumOfCopies(const QStringList& texts, CopiesIn carriers);
 
-// Which words for the paper a path of the program knows. The offer of a whole folder knows fewer of them than the click
-// of a picture, and labs have codes that rely on it.
+// Which words for the paper kind are known. Adding a whole folder knows fewer words than a click on a picture; labs
+// rely on the resulting codes.
 enum class PaperWords { All, WholeFolder };
 
-// "M" or "G"; for a word that is not known, the letter of the code before.
+// "M" or "G"; previous when the word is not known.
 QChar paperLetter(const QString& maat, PaperWords words, QChar previous);
 
-// Four characters: the size code of the paper; for a special size ("zz/zz") the customer's own code, blank by default.
+// Four characters: the size code of the paper. For a special size ("zz/zz") the customer's own code, blank by default.
 QString sizeField(const OrderDetails& shemot);
 
 } // namespace lumora

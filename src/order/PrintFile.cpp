@@ -10,8 +10,8 @@
 namespace lumora {
 namespace {
 
-constexpr qint64 markerWidth = 10; // the field that notes base + piece
-constexpr qint64 numberWidth = 2;  // the number behind each piece
+constexpr qint64 markerWidth = 10; // characters of the field with base + piece length
+constexpr qint64 numberWidth = 2;  // bytes of the number behind each piece
 
 Failure damaged(const QString& reason) {
     return {Failure::Kind::Damaged, reason};
@@ -24,7 +24,7 @@ std::optional<Failure> outOfRange(PrintFileShape shape) {
                    QStringLiteral("A print file has 1 to 32767 pieces, not %1.").arg(shape.chunks)};
 }
 
-// The noted length of a piece: digits, then blanks to the end of the field.
+// Reads the noted piece length: digits, then blanks to the end of the field. No value when the field is wrong.
 std::optional<qint64> readMarker(const QByteArray& field, PrintFileShape shape) {
     const QByteArray digits = field.left(field.indexOf(' ') < 0 ? field.size() : field.indexOf(' '));
     bool ok = false;
@@ -46,7 +46,7 @@ bool piecesCarryTheirNumbers(const QByteArray& bytes, qint64 piece, int chunks) 
     return true;
 }
 
-// Length of the picture inside taken, which holds all pieces and the remainder.
+// The length of the picture in taken, the bytes of all pieces and the remainder.
 qint64 pictureLength(const QByteArray& taken, qint64 piece, qint64 remainder, int chunks) {
     const bool cameOut = 2 * remainder < chunks;
     if (cameOut)

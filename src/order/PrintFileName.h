@@ -6,25 +6,24 @@
 
 namespace lumora {
 
-// The name of a print file: how many copies on which paper, the place in the order, the kind of order and the
-// customer's own name for the picture, in hexadecimal so that a name in Hebrew survives the transfer and the lab's file
-// system.
+// The name of a print file: print code, number of the basket line, kind of order, and the picture's own name in
+// hexadecimal, so that a Hebrew name survives the transfer and the lab's file system.
 struct PrintFileName {
-    QString code;     // print code, 9 characters: copies 2, size 4, paper 1, border 2
-    int index = 0;    // in the order's list, from 0; only the last four digits are kept
+    QString code;     // print code, 9 characters
+    int index = 0;    // of the basket line, from 0; the name holds its last four digits
     int optint = 0;   // kind of order
-    QString baseName; // its last 20 characters are kept
+    QString baseName; // the name holds its last 20 characters
 
-    // "121015MWB0007_03FAEEE5F0E4203031.jpp"
+    // As "121015MWB0007_03FAEEE5F0E4203031.jpp".
     QString text() const;
 
-    // No value for a name that is not built so, an order sheet's for one.
+    // No value for a name of another form, such as an order sheet's.
     static std::optional<PrintFileName> parse(const QString& name);
 
     int copies() const;
 };
 
-// The base name as names and tails carry it: the file name less its last four characters, of that the last 20.
+// The base name in names and tails: the last 20 characters of the file name without its last four.
 QString PrintBaseName(const QString& path);
 
 } // namespace lumora

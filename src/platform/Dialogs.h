@@ -4,21 +4,20 @@
 
 namespace lumora {
 
-// What a page has to say or to ask outside its own controls. On screen each is a panel over the page; in tests a
-// recorded text.
+// Boxes and questions outside the controls of a page. On screen each is a panel over the page; tests record the texts.
 class Dialogs {
 public:
     virtual ~Dialogs() = default;
 
-    // A box with one button. Returns at once: boxes queue up, and the page goes on below them.
+    // Shows a box with one button and returns at once. Boxes queue up; the page goes on below them.
     virtual void message(const QString& text, const QString& title = {}) = 0;
 
-    // Waits for the answer; a box that is closed without one is a no.
+    // Waits for the answer; closing the box counts as no.
     virtual bool ask(const QString& question, const QString& title = {}) = 0;
 
-    // One file, as a drive path; empty when the customer cancels. prompt is what the customer reads above the list. A
-    // character of the path that lies outside the code page comes back as "?". Where every file is on offer, the list
-    // opens at initialFolder; pictures are first looked for where customers bring them.
+    // Lets the customer pick one file. Gives its drive path, empty when the customer cancels; a character outside the
+    // code page is "?". prompt stands above the list. With EveryFile the list opens at initialFolder, with Pictures at
+    // the media that customers bring.
     enum class Offer { Pictures, EveryFile };
     virtual QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
                              Offer offer = Offer::Pictures) = 0;

@@ -5,14 +5,13 @@
 
 namespace lumora {
 
-// The runs of the program over one data folder. Each marks itself there for as long as its object lives, so that a page
-// on which two runs would get in one another's way can ask. The mark is a shared lock on a hidden file: it goes with
-// the process, however that ends.
+// The running instances of the program on one data folder. Each object holds a shared lock on a hidden file there,
+// which the system releases when the process ends, so that a page can ask whether another instance would disturb it.
 class Instances {
 public:
     explicit Instances(const HostPath& dataFolder);
 
-    // True while another run is marked. False, too, where the folder takes no mark: nothing is known then.
+    // True while another instance holds the lock. False also when the folder takes no lock.
     bool another() const;
 
 private:

@@ -7,7 +7,7 @@
 
 #include <cstdint>
 
-// The small things that a page needs of the machine it runs on.
+// Small interfaces of the machine that pages use.
 namespace lumora {
 
 class Clock {
@@ -16,20 +16,19 @@ public:
     virtual QDateTime now() const = 0;
 };
 
-// Long loops yield here: pending events are handled and the page is painted, so that a click or a timer may run between
-// two steps.
+// Long loops call it: pending events are handled and the page is painted, so a click or a timer may run inside.
 class EventPump {
 public:
     virtual ~EventPump() = default;
     virtual void pump() = 0;
-    // True while a pump is under way, so that a handler further out is still running.
+    // True while a pump runs, that is, while a handler further out has not returned.
     virtual bool pumping() const = 0;
 };
 
 class Shell {
 public:
     virtual ~Shell() = default;
-    // Results are not examined: a missing browser or file manager passes in silence.
+    // Errors are ignored: with no browser or file manager nothing happens.
     virtual void openWebPage(const QString& url) = 0;
     virtual void openFolder(const QString& drivePath) = 0;
     virtual void copyToClipboard(const QString& text) = 0;
@@ -38,7 +37,7 @@ public:
 class Volume {
 public:
     virtual ~Volume() = default;
-    // A stable signed 32-bit number of the file system that a drive root lies on.
+    // A stable signed 32-bit number of the file system on which a drive's root folder lies.
     virtual Result<std::int32_t> serial(const QString& driveRoot) const = 0;
 };
 

@@ -12,7 +12,7 @@ class Mail;
 class Shell;
 class Volume;
 
-// What a page may use of the machine. main() makes one; tests make one of real files in a temporary folder and fakes.
+// All that a page may use of the machine. main() makes one; tests make one of a temporary folder and fakes.
 struct Platform {
     const Files& files;
     Dialogs& dialogs;

@@ -6,14 +6,13 @@
 
 namespace lumora {
 
-// The pump of the running program.
 class QtEventPump : public EventPump {
 public:
     void pump() override;
     bool pumping() const override { return m_depth > 0; }
 
 private:
-    QElapsedTimer m_sinceLast; // since the end of the last turn of the event loop
+    QElapsedTimer m_sinceLast; // the end of the last turn of the event loop
     int m_depth = 0;
 };
 

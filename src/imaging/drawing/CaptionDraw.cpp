@@ -18,11 +18,11 @@
 namespace lumora {
 namespace {
 
-// Letters are laid out once at this size and scaled as outlines, so that preview and print break into the same places
-// to the fraction of a pixel, whatever their size.
+// Letters are laid out at this pixel size and scaled as outlines, so that preview and print have the same line widths
+// whatever their size.
 constexpr int layoutSize = 256;
 
-// The line's outlines from its left end on the base line, and its advance.
+// One line of text: its outlines from the left end of the base line, and its advance, in layout pixels.
 struct OutlinedLine {
     QPainterPath path;
     double advance = 0;
@@ -52,7 +52,7 @@ OutlinedLine outlined(const QString& text, const QFont& font) {
     return result;
 }
 
-// The caption around its anchor, in layout pixels.
+// The outlines of the whole caption with its anchor at (0, 0), in layout pixels.
 QPainterPath outlinesOf(const PictureCaption& caption) {
     QPainterPath block;
     const QString family = installedFamily(caption.family);
@@ -76,7 +76,7 @@ QPainterPath outlinesOf(const PictureCaption& caption) {
         block.addPath(line.path.translated(left + em / 6, top + metrics.ascent()));
         top += metrics.lineSpacing();
     }
-    block.setFillRule(Qt::WindingFill); // letters that overlap must not cut holes
+    block.setFillRule(Qt::WindingFill); // overlapping letters must not cut holes
     return block;
 }
 
@@ -84,7 +84,7 @@ bool sameOutlines(const PictureCaption& a, const PictureCaption& b) {
     return a.text == b.text && a.family == b.family && a.bold == b.bold && a.italic == b.italic && a.align == b.align;
 }
 
-// Shadow and text on the pixels within limit; anchor is where the shadow stands.
+// Draws shadow and text; pixels outside limit are left out. anchor is the point where the shadow stands.
 CaptionInk painted(const PictureCaption& caption, const QPainterPath& outlines, QPointF anchor, PaperScale scale,
                    const std::optional<QRect>& limit) {
     const double size = std::max(8, caption.emSize) * scale.x / layoutSize;

@@ -6,27 +6,28 @@
 
 namespace lumora {
 
-// The colour part of a 5x5 matrix: a row vector (red, green, blue) times the matrix, on 0 to 255, alpha unchanged. The
-// result of each channel is the floor of the exact value, held within 0 to 255.
+// The colour part of a 5x5 matrix: a row vector (red, green, blue), each 0 to 255, times the matrix; alpha is
+// unchanged. Each resulting channel is rounded down and held within 0 to 255.
 class ColourMatrix {
 public:
-    // Changes nothing.
+    // The identity.
     ColourMatrix();
 
-    // Gains on the diagonal and crossGain everywhere else: every colour and brightness step of the editor.
+    // The gains on the diagonal and crossGain in every other entry: all colour and brightness steps of the editor.
     static ColourMatrix fromGains(float red, float green, float blue, float crossGain);
 
-    // Every channel becomes weight times (red + green + blue).
+    // Every channel becomes weight * (red + green + blue).
     static ColourMatrix grey(float weight);
 
-    // True when no pixel can change: the cross gain of a thousandth adds at most half a step, and the floor drops it.
+    // True when no pixel changes: the diagonal is 1 and each other entry at most 0.0015, so that a channel grows by
+    // less than one step and is rounded down again.
     bool changesNothing() const;
 
-    // entry(row, column): how much of input channel row goes into output channel column; 0 red, 1 green, 2 blue.
+    // The share of input channel row in output channel column; 0 red, 1 green, 2 blue.
     float entry(int row, int column) const { return m_entries[static_cast<std::size_t>(row * 3 + column)]; }
 
     Bitmap applied(const Bitmap& picture) const;
-    // In place; the picture has no transparency.
+    // Changes picture itself, which must have no transparency.
     void apply(Bitmap& picture) const;
 
 private:

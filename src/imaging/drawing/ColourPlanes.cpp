@@ -19,7 +19,7 @@ constexpr int fixed(double value) {
 } // namespace
 
 void lumaAndChroma(const QRgb* line, int width, unsigned char* y, unsigned char* cb, unsigned char* cr) {
-    // Each row of the matrix sums to exactly 1 or 0, so that grey stays grey.
+    // The coefficients of a row sum to exactly 1 (luma) or 0 (chroma), so that grey stays grey.
     constexpr int yr = fixed(0.299);
     constexpr int yb = fixed(0.114);
     constexpr int yg = one - yr - yb;

@@ -22,7 +22,7 @@ struct Turn {
     double sine;
 };
 
-// Quarter turns are exact, so that their edges stay hard and their pixels where they were.
+// Quarter turns are exact, so that their edges stay hard and pixels keep their values.
 Turn turnOf(int rotationCode) {
     const int degrees = ((rotationCode - 180) % 360 + 360) % 360;
     switch (degrees) {
@@ -40,13 +40,12 @@ Turn turnOf(int rotationCode) {
     }
 }
 
-// In whole pixels, rounded down, as the edit record counts.
+// The edit record counts from the middle in whole pixels, rounded down.
 int middleOf(int side) {
     return side / 2;
 }
 
-// The picture's own position of a point of the paper: u to the right and v down in zoomed pixels, (0, 0) the picture's
-// corner.
+// Maps a point of the paper to the picture: u to the right and v down in zoomed pixels, (0, 0) the picture's corner.
 struct Inverse {
     Turn turn;
     double originX;
@@ -61,7 +60,7 @@ struct Inverse {
     double v(double x, double y) const { return -turn.sine * x + turn.cosine * y + originY; }
 };
 
-// The part of [from, to) in which low <= start + step * x <= high at pixel centres.
+// The part of the columns [from, to) whose pixel centres fulfil low <= start + step * x <= high.
 std::pair<int, int> narrowed(std::pair<int, int> range, double start, double step, double low, double high) {
     if (step == 0.0)
         return start >= low && start < high ? range : std::pair(0, 0);
@@ -73,10 +72,10 @@ std::pair<int, int> narrowed(std::pair<int, int> range, double start, double ste
     return {std::max(range.first, held(std::ceil(first - 1e-9))), std::min(range.second, held(std::ceil(last - 1e-9)))};
 }
 
-// How far samples reach beyond the picture's edge, and a little more.
+// Samples reach at most this many pixels beyond the picture's edge.
 constexpr int margin = 6;
 
-// The toned part of the source that the paper can show, with its edges repeated.
+// The part of the source that the paper shows, after the colour matrix, with its edge pixels repeated around it.
 class PreparedSource {
 public:
     PreparedSource(const Bitmap& source, QRect wanted, const ColourMatrix& matrix)
@@ -127,7 +126,7 @@ std::uint32_t blended(std::uint32_t below, std::uint32_t above, double coverage)
     return result;
 }
 
-// Source rows and columns that samples for this paper can touch, beyond lets them pass the source's edge.
+// Source rows and columns that samples for this paper touch; at most beyond pixels of them lie outside the source.
 QRect touched(const Placement& placement, PictureSize paper, PictureSize source, int beyond) {
     const PictureSize zoomed = placement.zoomed();
     const Inverse inverse(placement, zoomed);
@@ -158,7 +157,7 @@ QRect touched(const Placement& placement, PictureSize paper, PictureSize source,
     return {x0, y0, x1 - x0, y1 - y0};
 }
 
-// padded: its first pixel is the pixel corner of a picture of the size whole.
+// padded shows part of a picture of the size whole; its pixel (0, 0) is the picture's pixel corner.
 void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, PictureSize whole,
                  const Placement& placement) {
     const PictureSize zoomed = placement.zoomed();
@@ -171,7 +170,7 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
     const bool level = inverse.turn.cosine == 0 || inverse.turn.sine == 0;
     const double stepU = inverse.turn.cosine;
     const double stepV = -inverse.turn.sine;
-    const double outer = level ? 0.0 : 0.5; // how far coverage reaches past the edge
+    const double outer = level ? 0.0 : 0.5; // pixels by which the smooth edge reaches past the picture
     for (int y = 0; y < size.height; ++y) {
         const double startU = inverse.u(0, y + 0.5);
         const double startV = inverse.v(0, y + 0.5);
@@ -190,7 +189,7 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
 
         const double u = startU + stepU * (from + 0.5);
         const double v = startV + stepV * (from + 0.5);
-        // Half a phase of the sampler's weights, which cut the position.
+        // The sampler cuts positions to 256 phases; half a phase more makes that a rounding.
         const double halfPhase = 1.0 / 512.0;
         const SampleLine line{fixed(u * scaleX - 0.5 - corner.x() + halfPhase),
                               fixed(v * scaleY - 0.5 - corner.y() + halfPhase), fixed(stepU * scaleX),
@@ -217,14 +216,14 @@ void drawSamples(Bitmap& paper, const PaddedPicture& padded, QPoint corner, Pict
     }
 }
 
-// The tiles of a paper that are wanted, joined into larger rectangles where they stand side by side and then one above
-// the other.
+// The tiles of the paper for which wanted() is true, joined into larger rectangles: neighbours in a row first, then
+// equal runs below each other.
 template <class Wanted>
 std::vector<QRect> joinedTiles(PictureSize paper, const Wanted& wanted) {
     constexpr int tileWidth = 64;
     constexpr int tileHeight = 32;
     std::vector<QRect> done;
-    std::vector<QRect> open; // they reach down to the band
+    std::vector<QRect> open; // rectangles that reach down to the current row of tiles
     for (int top = 0; top < paper.height; top += tileHeight) {
         const int height = std::min(tileHeight, paper.height - top);
         std::vector<QRect> band;
@@ -331,7 +330,7 @@ KeyedFrame keyedFrame(const Bitmap& frame, PictureSize paper) {
         !keyed.reinterpretAsFormat(QImage::Format_ARGB32_Premultiplied))
         return {};
     constexpr int solid = 24;
-    // Where something shows, in stretches of each row.
+    // For each row of the frame: whether a stretch of so many pixels shows anything.
     constexpr int stretch = 16;
     const int stretches = (keyed.width() + stretch - 1) / stretch;
     std::vector<std::uint8_t> shows(static_cast<std::size_t>(keyed.height()) * static_cast<std::size_t>(stretches));
@@ -350,7 +349,7 @@ KeyedFrame keyedFrame(const Bitmap& frame, PictureSize paper) {
                 row[x] = qPremultiply((row[x] & 0x00FFFFFFU) | (static_cast<QRgb>(11 * sum) << 24));
         }
     }
-    // What the curve of the stretching reaches around a pixel of the paper, and a little more.
+    // The cubic of the resampling reaches 2 source steps around a pixel; one more for the rounding.
     const double stepX = double(keyed.width()) / paper.width;
     const double stepY = double(keyed.height()) / paper.height;
     const auto reach = [](double step) { return 2 * std::max(1.0, step) + 1; };

@@ -56,7 +56,7 @@ const QRgb* rowOf(const Bitmap& picture, int y) {
     return reinterpret_cast<const QRgb*>(picture.image().constScanLine(y));
 }
 
-// The file's bytes, some rows at a time.
+// Gives the bytes of the file in parts of about 1 MiB; an empty part is the end.
 class Parts {
 public:
     explicit Parts(const Bitmap& picture)

@@ -10,26 +10,26 @@
 #include <filesystem>
 #include <functional>
 
-// Bitmap files of 24 bits a pixel, uncompressed, rows from the bottom up: each pixel has its fixed place in the file.
-// Transparency is not kept.
+// Bitmap files: 24 bits a pixel, uncompressed, rows from the bottom up, so that each pixel has a fixed place in the
+// file. Transparency is lost.
 namespace lumora {
 
-// Written row by row, so that no second copy of a large picture lies in memory; synced and renamed, the old file or the
-// whole new one.
+// Writes in parts, without a second copy of the picture in memory, to a temporary file that is synced and renamed: the
+// path holds the old file or the whole new one.
 Result<void> saveBmp(const Bitmap& picture, const std::filesystem::path& path);
 
-// The same bytes into new content, until stopped says that nobody wants them any more.
+// Appends the bytes of the file to content; stops when stopped() becomes true.
 void appendBmp(const Bitmap& picture, NewContent& content, const std::function<bool()>& stopped);
 
-// A file that saveBmp wrote, open for rewriting parts of it in place.
+// A file written by saveBmp, open for rewriting parts of it in place.
 class BmpRows {
 public:
-    // Failure unless the file has the size that such a picture has.
+    // Fails unless the file has exactly the size of such a picture's file.
     static Result<BmpRows> open(const std::filesystem::path& path, QSize picture);
 
-    // Only the rows of part are touched. The picture has the file's size; part lies inside it.
+    // Rewrites the pixels of part. picture has the size given to open(); part lies inside it.
     Result<void> write(const Bitmap& picture, const QRect& part);
-    // The part as the file holds it.
+    // The pixels of part as the file holds them.
     Result<Bitmap> read(const QRect& part) const;
 
 private:

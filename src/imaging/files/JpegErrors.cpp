@@ -18,8 +18,8 @@ namespace {
     std::longjmp(errors->back, 1);
 }
 
-// Bytes too many before a marker, an unusual colour note or version: such files are whole, and cameras write them. All
-// other warnings mean that part of the picture would be made up.
+// Bytes before a marker, an unknown colour note or version: cameras write such files, and the picture is complete. With
+// any other warning libjpeg would invent part of the picture.
 bool isHarmless(int warning) {
     return warning == JWRN_EXTRANEOUS_DATA || warning == JWRN_ADOBE_XFORM || warning == JWRN_JFIF_MAJOR ||
            warning == JWRN_BOGUS_ICC;

@@ -10,11 +10,11 @@
 
 namespace lumora {
 
-// How libjpeg names the bytes of a Bitmap.
+// libjpeg's name for the byte order of a Bitmap's pixels.
 constexpr J_COLOR_SPACE bitmapColours = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? JCS_EXT_BGRX : JCS_EXT_XRGB;
 
-// libjpeg reports an error by a call that may not return. The jump goes back to guarded(), whose argument therefore may
-// call libjpeg but must own nothing that has a destructor.
+// Turns libjpeg's errors, which must not return, into a jump back to guarded(). The argument of guarded() may call
+// libjpeg but must own nothing with a destructor, since the jump skips destructors.
 struct JpegErrors {
     jpeg_error_mgr manager{};
     std::jmp_buf back{};
@@ -22,7 +22,7 @@ struct JpegErrors {
     QString text;
     bool outOfMemory = false;
 
-    // The manager to be set as cinfo.err before the object is created.
+    // Gives the manager for cinfo.err; called before the libjpeg object is created.
     jpeg_error_mgr* install();
 
     template <class Calls>

@@ -15,10 +15,10 @@ namespace lumora {
 
 namespace {
 
-// A progressive file may ask for the whole picture to be gone over again and again; real ones have about ten scans.
+// A hostile progressive file may have thousands of scans, each over the whole picture; real files have about ten.
 constexpr int maxScans = 200;
 
-// Ink on paper to light. Files with the Adobe mark hold the inks inverted, as light passed by each ink.
+// Inks to light. Files with the Adobe mark hold the inks inverted, as the light that each ink lets through.
 void convertInks(const unsigned char* inks, QRgb* line, int width, bool inverted) {
     for (int x = 0; x < width; ++x, inks += 4) {
         const auto light = [&](int ink) {
@@ -121,7 +121,7 @@ struct JpegReader::State {
         });
     }
 
-    // One line of 32-bit pixels; inkLine is room for one line of inks.
+    // Reads one row of 32-bit pixels; inkLine is the buffer for a row of inks, empty for other pictures.
     bool readLine(unsigned char* line, std::vector<unsigned char>& inkLine) {
         JSAMPROW target = inkLine.empty() ? line : inkLine.data();
         if (!errors.guarded([&] { jpeg_read_scanlines(&info, &target, 1); }))
@@ -132,7 +132,7 @@ struct JpegReader::State {
         return true;
     }
 
-    // Reads to the end of the file's data, so that a file that is cut short behind the last line is found out too.
+    // Reads to the end of the file, so that a file cut short behind the last row fails too.
     bool finish() {
         return errors.guarded([&] { jpeg_finish_decompress(&info); });
     }
@@ -168,8 +168,8 @@ Result<std::unique_ptr<JpegReader>> JpegReader::open(PictureInput input) {
     const auto height = static_cast<std::int64_t>(s.info.image_height);
     if (auto bounds = checkPictureBounds(s.input.path(), width, height); !bounds)
         return bounds.failure();
-    // A block of 64 pixels takes at least one bit, so a header that claims more than the file can hold is refused
-    // before memory is taken for it. Arithmetic coding knows no such bound.
+    // A block of 64 pixels takes at least one bit, so a header that claims more pixels than the file can hold is
+    // refused before memory is taken. Arithmetic coding has no such bound.
     if (s.info.arith_code == FALSE && width * height / 64 / 8 > s.input.size())
         return pictureFailure(s.input.path(), Failure::Kind::Damaged,
                               QStringLiteral("the file is too short for %1 x %2 pixels").arg(width).arg(height));
@@ -217,7 +217,7 @@ Result<void> JpegReader::readRawPlanes(PlaneTaker& taker) {
     std::vector<std::vector<JSAMPROW>> rows;
     for (int i = 0; i < s.info.num_components; ++i) {
         const jpeg_component_info& component = s.info.comp_info[i];
-        // A scaled decode shrinks each component by its own measure: often chroma less than luma.
+        // A scaled decode shrinks each component by its own factor, chroma often less than luma.
         const double shrunk = static_cast<double>(DCTSIZE) / component.DCT_scaled_size;
         PlaneLayout plane;
         plane.width = static_cast<int>(component.downsampled_width);

@@ -10,8 +10,7 @@
 
 namespace lumora {
 
-// One JPEG file on its way in. libjpeg's own way with an error is to end the process; here it is a failure, and so is a
-// warning that data is missing or can't be true.
+// Reads one JPEG file. Errors of libjpeg are failures, and so are its warnings that data is missing or wrong.
 class JpegReader {
 public:
     // Reads the header.
@@ -22,15 +21,15 @@ public:
 
     PictureSize size() const;
 
-    // The whole picture in colour; the reader is used up. denominator 1, 2, 4 or 8 asks for the picture shrunk by it,
-    // each side rounded up.
+    // The whole picture in colour, shrunk by denominator (1, 2, 4 or 8), each side rounded up. One call of readBitmap
+    // or readPlanes uses the reader up.
     Result<Bitmap> readBitmap(int denominator = 1);
 
-    // True when the file holds luma and chroma planes, or luma alone: then readPlanes gives them as they lie there. The
-    // planes of other pictures (RGB, inks) are made of whole pixels, which takes longer.
+    // True when the file stores luma and chroma planes, or luma alone; readPlanes gives them as stored. For other
+    // pictures (RGB, inks) readPlanes converts pixels, which takes longer.
     bool hasPlanes() const;
 
-    // The picture as luma and chroma, row by row; the reader is used up. denominator as above.
+    // The picture as luma and chroma planes, row by row; denominator as in readBitmap.
     Result<void> readPlanes(int denominator, PlaneTaker& taker);
 
 private:

@@ -11,13 +11,14 @@
 
 namespace lumora {
 
-// One JPEG file on its way out: 4:2:0, the slow integer transform and the standard tables. Quality is held within 0 to
-// 100. An error of the encoder stays until finish() tells it.
+// Writes one JPEG file: chroma 4:2:0, the slow integer transform, the standard tables. Quality is held within 0 to 100.
+// finish() tells the first error of the encoder.
 class JpegWriter {
 public:
     enum class Input { Pixels, Planes };
 
-    // A luma plane of the picture's size and two chroma planes of half of it, rounded up.
+    // The rows of one call of planeRows: a luma plane of the picture's size, two chroma planes of half of it, rounded
+    // up.
     static constexpr int lumaRows = 16;
     static constexpr int chromaRows = 8;
     struct PlaneRows {
@@ -31,9 +32,9 @@ public:
     JpegWriter(const JpegWriter&) = delete;
     JpegWriter& operator=(const JpegWriter&) = delete;
 
-    // The next line of 32-bit pixels, alpha ignored.
+    // The next row of 32-bit pixels; alpha is ignored.
     void line(const unsigned char* pixels);
-    // The next 16 lines as planes, each row padded by its last sample to a multiple of 8.
+    // The next 16 rows as planes, each row padded with its last sample to a multiple of 8.
     void planeRows(PlaneRows& rows);
 
     Result<QByteArray> finish();
@@ -43,7 +44,7 @@ private:
     std::unique_ptr<State> m_state;
 };
 
-// What is transparent lies on white.
+// Transparent pixels become white.
 Result<QByteArray> writeJpeg(const Bitmap& picture, int quality);
 
 } // namespace lumora

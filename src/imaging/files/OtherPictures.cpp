@@ -28,8 +28,8 @@ Result<QByteArray> readAll(const PictureInput& input) {
     return bytes;
 }
 
-// What the reader of BMP files does not look at: absurd sizes, which it takes for damage, and a file that breaks off,
-// which it takes for a whole one and leaves the rest black.
+// Qt's reader of BMP files takes an absurd size for damage, and takes a file that is cut short for whole, the rest
+// black; both are checked here.
 Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
     constexpr qsizetype headers = 14 + 40;
     const auto* data = reinterpret_cast<const uchar*>(bytes.constData());
@@ -48,7 +48,8 @@ Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
     const auto compression = qFromLittleEndian<quint32>(data + 30);
     if (auto bounds = checkPictureBounds(input.path(), width, height); !bounds)
         return bounds;
-    const bool runLengths = compression == 1 || compression == 2; // there the size says nothing
+    const bool runLengths =
+        compression == 1 || compression == 2; // the header does not tell the length of compressed rows
     if (!runLengths && offset + (width * bits + 31) / 32 * 4 * height > bytes.size())
         return cutShort();
     return {};
@@ -56,7 +57,7 @@ Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
 
 template <class Value, class Use>
 Result<Value> withReader(const PictureInput& input, const Use& use) {
-    // Our own bounds stand before each reading; Qt's limit of 128 MiB would refuse good pictures.
+    // checkPictureBounds refuses what is too large; Qt's limit of 128 MiB would refuse good pictures.
     static std::once_flag limitLifted;
     std::call_once(limitLifted, [] { QImageReader::setAllocationLimit(0); });
 

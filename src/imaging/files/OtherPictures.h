@@ -7,7 +7,7 @@
 
 namespace lumora {
 
-// BMP and PNG files, read by the kind that was found in them. Transparent places stay transparent.
+// BMP and PNG files, read as the format that PictureInput found in the content. Transparency is kept.
 Result<PictureSize> readOtherPictureSize(const PictureInput& input);
 Result<Bitmap> readOtherPicture(const PictureInput& input);
 

@@ -9,11 +9,10 @@
 #include <filesystem>
 #include <vector>
 
-// Picture files. What a file is goes by its content and never by its ending: JPEG of every kind (grey, progressive,
-// CMYK), BMP and PNG. The orientation that a camera may have noted is ignored everywhere alike. A damaged or cut-short
-// file is a failure: it must never print half grey. Files are opened for reading only. Bounds are checked before memory
-// is taken: 65,500 pixels a side and 250 million in all. Every function here may be called from several threads at
-// once.
+// Picture files: JPEG of every kind (grey, progressive, CMYK), BMP and PNG. The content decides the format, never the
+// ending. The orientation noted by a camera is ignored. A damaged or cut-short file is a failure, so that no print
+// comes out half grey. Files are opened for reading only. At most 65,500 pixels a side and 250 million in all, checked
+// before memory is taken. All functions may be called from several threads at once.
 namespace lumora {
 
 struct PictureSize {
@@ -22,42 +21,41 @@ struct PictureSize {
     bool operator==(const PictureSize&) const = default;
 };
 
-// Where the time of one picture went, in milliseconds. Its stages run interleaved, row by row.
+// Where the time of one picture went, in milliseconds. The stages run interleaved, row by row.
 struct PictureTimes {
     double decode = 0;
     double draw = 0;
     double encode = 0;
 };
 
-// From the header alone.
+// Reads the header alone.
 Result<PictureSize> readPictureSize(const std::filesystem::path& path);
 
-// The whole picture.
 Result<Bitmap> loadPicture(const std::filesystem::path& path);
 
-// The picture shrunk smoothly to exactly size (the caller keeps the proportions), by a scaled decode where that loses
-// nothing; enlarged smoothly where size is larger.
+// The picture resampled to exactly size (the caller keeps the proportions), with a scaled decode where that loses no
+// quality.
 Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize size);
 
-// The part of it that is needed. The part may reach beyond the picture, whose edge is repeated there.
+// The same picture, of which only part is made. part may reach beyond the picture, where the edge is repeated.
 Result<Bitmap> loadPicturePart(const std::filesystem::path& path, PictureSize size, const QRect& part);
 
-// The size of the small picture in a cell: the longer side fills the cell, the other follows the proportion, at
-// least 1.
+// The size of the small picture in a square cell of cell pixels: the longer side fills the cell, the other keeps the
+// proportion and is at least 1.
 PictureSize smallPictureSize(PictureSize picture, int cell);
 
-// The small pictures of a page, each in its size of smallPictureSize, read on the machine's cores side by side. One
-// result a path, in order: a file that can't be read has its failure there, and the others come all the same.
+// The small pictures of a page, each of its smallPictureSize, read on all cores side by side. One result a path, in
+// order; a file that can't be read fails alone.
 std::vector<Result<Bitmap>> loadSmallPictures(const std::vector<std::filesystem::path>& paths, int cell);
 
-// The bytes of a JPEG file of the picture, 4:2:0. Quality 0 to 100, held within that range.
+// The picture as the bytes of a JPEG file, chroma 4:2:0. Quality is held within 0 to 100.
 Result<QByteArray> encodeJpeg(const Bitmap& picture, int quality);
 
-// The same into a file, written whole or not at all.
+// The same written to path, whole or not at all.
 Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, int quality);
 
-// A JPEG (or another picture) scaled to exactly size on white as the bytes of a JPEG file: what a plain print is made
-// of. It touches nothing but the source, so that the next picture of an order can be made ahead on another thread.
+// The picture at source, scaled to exactly size on white, as the bytes of a JPEG file: the content of a plain print. It
+// changes no state, so that the next picture of an order can be prepared on another thread.
 Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
                                       PictureTimes* times = nullptr);
 

@@ -42,7 +42,7 @@ Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t 
 Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
     PictureInput input;
     input.m_path = path;
-    // A pipe that happens to be called .jpg must not make the page wait for a writer.
+    // O_NONBLOCK: a pipe called .jpg must not make the page wait for a writer.
     input.m_file = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     struct stat status {};
     if (input.m_file < 0 || ::fstat(input.m_file, &status) != 0)

@@ -8,12 +8,12 @@
 
 namespace lumora {
 
-// A picture file open for reading, and what its first bytes say it is.
+// A picture file open for reading, with the format that its first bytes show.
 class PictureInput {
 public:
     enum class Format { Jpeg, Bmp, Png };
 
-    // The failure tells an empty file, a folder or pipe, and a file of another kind apart.
+    // An empty file, a folder or pipe, and a file of another format fail each with its own reason.
     static Result<PictureInput> open(const std::filesystem::path& path);
 
     PictureInput(PictureInput&& other) noexcept;
@@ -24,7 +24,7 @@ public:
     Format format() const { return m_format; }
     std::int64_t size() const { return m_size; }
 
-    // Bytes read, 0 at the end, or -1 with errno set.
+    // Gives the number of bytes read, 0 at the end, or -1 with errno set.
     std::ptrdiff_t read(void* target, std::size_t count) const;
 
 private:
@@ -39,7 +39,7 @@ private:
 // A failure of this picture: "PATH: reason".
 Failure pictureFailure(const std::filesystem::path& path, Failure::Kind kind, const QString& reason);
 
-// The bounds that every picture keeps, checked before memory is taken.
+// Fails when a side is under 1 or over 65,500, or with more than 250 million pixels.
 Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t width, std::int64_t height);
 
 } // namespace lumora

@@ -15,7 +15,7 @@ namespace lumora {
 namespace HWY_NAMESPACE {
 namespace hn = hwy::HWY_NAMESPACE;
 
-// entries[row * 3 + column], in the order red, green, blue.
+// entries[row * 3 + column] in the order red, green, blue.
 void applyMatrix(const float* entries, const std::uint32_t* from, std::uint32_t* to, int pixels) {
     const hn::ScalableTag<std::uint32_t> du;
     const hn::RebindToSigned<decltype(du)> di;
@@ -24,8 +24,8 @@ void applyMatrix(const float* entries, const std::uint32_t* from, std::uint32_t*
     const auto byteMask = hn::Set(du, 0xFF);
     const auto zero = hn::Zero(df);
     const auto top = hn::Set(df, 255.0F);
-    // An exact whole number must not fall below itself by the rounding of single precision; the smallest step that a
-    // record can hold is a thousandth, far above this.
+    // Single precision may give a whole number as slightly less, which would be rounded down. The lift is far below a
+    // thousandth, the smallest step of an edit record.
     const auto lift = hn::Set(df, 1.0F / 4096.0F);
 
     const auto convert = [&](auto pixel) HWY_ATTR {
@@ -57,7 +57,7 @@ void applyMatrix(const float* entries, const std::uint32_t* from, std::uint32_t*
     }
 }
 
-// In whole vectors; gives how many pixels it did.
+// Handles the whole vectors of the row; returns the number of pixels done.
 int splitWhole(const std::uint32_t* from, int width, std::uint8_t* const* planes, bool fourth) {
 #if HWY_TARGET == HWY_SCALAR
     static_cast<void>(from), static_cast<void>(width), static_cast<void>(planes), static_cast<void>(fourth);
@@ -132,7 +132,8 @@ int colourWhole(const std::uint8_t* y, const std::uint8_t* cb, const std::uint8_
 #endif
 }
 
-// weights: for each of 256 phases the four weights as [w0 w1 w0 w1 w0 w1 w0 w1] [w2 w3 w2 w3 w2 w3 w2 w3], 14 bits.
+// weights: for each of 256 phases the four weights, 14 fraction bits, as [w0 w1 w0 w1 w0 w1 w0 w1] [w2 w3 w2 w3 w2 w3
+// w2 w3].
 #if HWY_TARGET == HWY_SCALAR
 void sample(const std::uint32_t* origin, std::ptrdiff_t stride, SampleLine line, const std::int16_t* weights,
             std::uint32_t* out, int count) {
@@ -169,7 +170,8 @@ void sample(const std::uint32_t* origin, std::ptrdiff_t stride, SampleLine line,
     const auto roundRow = hn::Set(d32, 1 << 7);
     const auto roundAll = hn::Set(d32, 1 << 19);
     const auto lowHalf = hn::Set(d32, 0xFFFF);
-    // Four pixels to 16 bits, a channel of one beside the same of the next: pixels 0 and 1, and 2 and 3.
+    // Shuffles for four pixels to 16 bits, each channel of one pixel beside that of the next: pixels 0 and 1, and 2 and
+    // 3.
     constexpr std::uint8_t none = 0x80;
     alignas(16) static constexpr std::uint8_t nearBytes[16] = {0, none, 4, none, 1, none, 5, none,
                                                                2, none, 6, none, 3, none, 7, none};
@@ -230,8 +232,8 @@ HWY_EXPORT(colourWhole);
 
 constexpr int phases = 256;
 
-// The cubic of Keys with a = -0.5 (IEEE Trans. ASSP-29, 1981), at distances 1+t, t, 1-t, 2-t. The rounded weights sum
-// to 16384: the largest takes what rounding left over.
+// The cubic of Keys with a = -0.5 (IEEE Trans. ASSP-29, 1981), at distances 1+t, t, 1-t, 2-t. The largest weight takes
+// the rounding error, so that the weights sum to 16384.
 std::array<std::int16_t, phases * 16> cubicWeights() {
     std::array<std::int16_t, phases * 16> table{};
     const auto cubic = [](double x) {

@@ -25,7 +25,8 @@ double cubic(double x) {
     return 0;
 }
 
-// Rounded so that the sum is exact: what is left over goes where rounding took most. exact becomes what was lost.
+// Rounds the weights so that their sum is exact; the remainder goes to those that lost most. exact becomes the rounding
+// errors.
 void roundToSum(std::span<double> exact, std::span<std::int16_t> weights) {
     const double sum = std::accumulate(exact.begin(), exact.end(), 0.0);
     int left = weightOne;
@@ -50,7 +51,7 @@ CubicWeights CubicWeights::make(const PlaneAxis& axis) {
     const int most = std::min(axis.source, static_cast<int>(std::ceil(4 * widened)) + 2);
     const auto target = static_cast<std::size_t>(axis.target);
     const auto stride = static_cast<std::size_t>(most);
-    // Each row of weights begins at its first weight that is not 0; what is behind its last one stays 0.
+    // A row of weights begins at its first weight that is not 0; places behind the last stay 0.
     std::vector<std::int16_t> wide(target * stride, 0);
     CubicWeights result;
     result.first.resize(target);
@@ -91,7 +92,7 @@ PlaneScaler::Weights::Weights(const PlaneAxis& acrossAxis, const PlaneAxis& down
     : across(acrossAxis)
     , down(downAxis)
     , rows(CubicWeights::make(downAxis)) {
-    // Taps of a row begin at an even sample, since columns are packed in pairs.
+    // The first tap of a column lies at an even sample, since the kernels read columns in pairs.
     const CubicWeights columns = CubicWeights::make(across);
     const auto [lowest, highest] = std::minmax_element(columns.first.begin(), columns.first.end());
     columnBegin = *lowest / 2 * 2;
@@ -106,7 +107,7 @@ PlaneScaler::Weights::Weights(const PlaneAxis& acrossAxis, const PlaneAxis& down
         std::copy_n(columns.weights.begin() + std::ptrdiff_t{from} * columns.taps, columns.taps,
                     pairWeights.begin() + std::ptrdiff_t{i} * pairs * 2 + first % 2);
     }
-    // The rows are blended in pairs too.
+    // The kernels read rows in pairs too.
     if (rows.taps % 2 != 0) {
         std::vector<std::int16_t> even;
         even.reserve(rows.weights.size() + static_cast<std::size_t>(down.target));
@@ -155,7 +156,7 @@ void PlaneScaler::rowsReady(int end) {
             --used;
         if (first + used > have)
             return;
-        // Where the weight is 0 any row serves.
+        // Places behind the last used row have the weight 0, so that row serves for them.
         for (int k = 0; k < taps; ++k)
             m_taps[static_cast<std::size_t>(k)] = inputRow(first + std::min(k, used - 1)) + m_weights->columnBegin;
         m_kernels.blendRows(m_taps.data(), weights, used + used % 2, m_weights->columnCount,

@@ -10,18 +10,18 @@
 
 namespace lumora {
 
-// One direction of a plane.
+// One direction of a plane, in samples.
 struct PlaneAxis {
-    int source = 0; // samples that carry the picture, without padding
+    int source = 0; // samples of the picture, without padding
     int target = 0;
-    double step = 1; // distance of two target samples in source samples
-    int first = 0;   // where the first target sample stands; it and the last may lie beyond the source
+    double step = 1; // source samples between two target samples
+    int first = 0;   // position of the first target sample; target samples may lie beyond the source
     bool operator==(const PlaneAxis&) const = default;
 };
 
-// Weights of an antialiased bicubic (a = -0.5, the kernel widened by the shrink): 14 fraction bits, and the weights of
-// a target sample sum to exactly 16384, so that a flat picture stays flat to the last bit. Beyond its ends the source
-// repeats its edge.
+// Weights of an antialiased bicubic (a = -0.5, the kernel widened by the shrink), 14 fraction bits. The weights of a
+// target sample sum to exactly 16384, so that a flat picture stays flat to the last bit. Outside the source its edge is
+// repeated.
 struct CubicWeights {
     int taps = 0;                      // the same for each target sample
     std::vector<std::int32_t> first;   // source sample of the first weight
@@ -31,7 +31,7 @@ struct CubicWeights {
     static CubicWeights make(const PlaneAxis& axis);
 };
 
-// Zeroed memory for samples, aligned for vector loads.
+// Zeroed memory for samples, aligned to 64 bytes for vector loads.
 template <class Sample>
 class SampleBuffer {
 public:
@@ -50,15 +50,15 @@ private:
     std::unique_ptr<Sample, Free> m_data;
 };
 
-// Scales one plane of bytes while its rows come in from the top; holds only the rows that are still needed.
+// Scales one plane of bytes while its rows come in from the top; keeps only the rows that are still needed.
 class PlaneScaler {
 public:
-    // rowsAtOnce: how many rows the giver writes before it calls rowsReady. rowBytes: how far it writes in a row. like:
-    // another plane of the picture; where its axes are the same its weights serve this one too.
+    // The giver writes rowsAtOnce rows of rowBytes bytes before each call of rowsReady. like is another plane of the
+    // picture, whose weights are shared if its axes are the same.
     PlaneScaler(PlaneAxis across, PlaneAxis down, int rowsAtOnce, int rowBytes,
                 const ResampleKernels& kernels = bestKernels(), const PlaneScaler* like = nullptr);
 
-    // The source that carries weight: only these rows and columns have to be written.
+    // The rows and columns of the source that have weight; only these must be written.
     struct Range {
         int begin;
         int end;
@@ -66,25 +66,25 @@ public:
     Range inputRows() const;
     Range inputColumns() const { return {m_weights->columnBegin, m_weights->columnBegin + m_weights->columnCount}; }
 
-    // Where row y is to be written; y may pass the end of the picture by padding.
+    // Where the giver writes row y; y may pass the picture's end by padding.
     std::uint8_t* inputRow(int y) { return m_input.data() + (y % m_inputRows) * m_inputStride; }
-    // All rows above end are written.
+    // Tells that all rows above end are written.
     void rowsReady(int end);
 
-    // Rows of the target below this one are ready. A row is padded by its last sample to a multiple of 8.
+    // Rows of the target below this number are ready, each padded with its last sample to a multiple of 8.
     int outputEnd() const { return m_outputEnd; }
-    // Not before release(y) and not from outputEnd() on.
+    // y is at least the last released row and less than outputEnd().
     std::uint8_t* outputRow(int y) { return m_output.data() + (y - m_outputBegin) * m_outputStride; }
-    // Rows below y are not asked for again.
+    // Tells that rows below y are no longer needed.
     void release(int y);
 
 private:
-    // In the order that the kernels want.
+    // The weights in the order that the kernels read.
     struct Weights {
         PlaneAxis across;
         PlaneAxis down;
         CubicWeights rows;
-        int columnBegin = 0; // the source columns that carry weight
+        int columnBegin = 0; // first source column with weight
         int columnCount = 0;
         std::vector<std::int32_t> firstPair;
         std::vector<std::int16_t> pairWeights;
@@ -96,7 +96,7 @@ private:
 
     const ResampleKernels& m_kernels;
     PlaneAxis m_down;
-    int m_outputCount = 0; // target samples of a row, rounded up to 8
+    int m_outputCount = 0; // samples of a target row, rounded up to 8
     std::shared_ptr<const Weights> m_weights;
 
     int m_inputRows = 0;

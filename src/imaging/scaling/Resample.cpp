@@ -21,10 +21,10 @@ double stepOf(double pitch, int sourceSize, int targetSize, int targetPitch) {
     return static_cast<double>(targetPitch) * sourceSize / targetSize / pitch;
 }
 
-// A scaler for each plane; what becomes of the rows is for those who derive from it.
+// Holds a scaler for each plane; a derived class takes the scaled rows.
 class ScalingTaker : public PlaneTaker {
 public:
-    // part of the target; where chroma is coarser it has to be the whole.
+    // part is the part of the target to make; it must be the whole target when chroma is coarser than luma.
     ScalingTaker(PictureSize source, PictureSize target, const QRect& part, int chromaPitch,
                  const ResampleKernels& kernels)
         : m_source(source)
@@ -57,7 +57,7 @@ public:
     }
 
 protected:
-    // More rows of each of scalers() may be ready; the last call comes when all are.
+    // Called when more rows of scalers() may be ready, the last time when all are.
     virtual void rowsScaled() = 0;
     std::vector<PlaneScaler>& scalers() { return m_scalers; }
     QRect part() const { return m_part; }
@@ -156,7 +156,7 @@ private:
 
 namespace {
 
-// source and target are of the same format, 32 bits; size is the whole picture's, part goes to target's corner at.
+// source and target have the same 32-bit format. size is that of the whole scaled picture, whose part is written to at.
 void resampleInto(QImage& target, QPoint at, const QImage& source, PictureSize size, const QRect& part,
                   const ResampleKernels& kernels) {
     const PlaneAxis across{source.width(), part.width(), stepOf(1, source.width(), size.width, 1), part.left()};
@@ -180,7 +180,7 @@ void resampleInto(QImage& target, QPoint at, const QImage& source, PictureSize s
         for (; next < scalers[0].outputEnd(); ++next) {
             for (std::size_t i = 0; i < rows.size(); ++i)
                 rows[i] = scalers[i].outputRow(next);
-            // The curve overshoots at edges, so that a colour may come out above its alpha.
+            // The cubic overshoots at edges, so that a colour may exceed its alpha; joinRow limits it.
             joinRow(rows, part.width(), reinterpret_cast<std::uint32_t*>(target.scanLine(at.y() + next)) + at.x());
         }
         for (PlaneScaler& scaler : scalers)

@@ -9,27 +9,25 @@
 #include <QByteArray>
 #include <QRect>
 
-// Scaling by the antialiased bicubic of PlaneScaler. Pixel centres lie at k + 0.5, the source repeats its edge, a flat
-// picture stays flat to the last bit.
+// Scaling by the antialiased bicubic of PlaneScaler. Pixel centres lie at k + 0.5, the edge of the source is repeated,
+// a flat picture stays flat to the last bit.
 namespace lumora {
 
-// Null when the picture is, when a side of size is under 1, or when memory is short.
+// Null when picture is null, when a side of size is under 1, or when memory is short.
 Bitmap resampled(const Bitmap& picture, PictureSize size, const ResampleKernels& kernels = bestKernels());
 
-// A part of the picture so scaled. It may reach beyond the picture, whose edge is repeated there.
+// Part of the scaled picture. part may reach beyond the picture, where the edge is repeated.
 Bitmap resampledPart(const Bitmap& picture, PictureSize size, const QRect& part,
                      const ResampleKernels& kernels = bestKernels());
 
-// A part of the paper, which is 32 bits without alpha, under the picture stretched over the whole of it. The picture
-// has no alpha either.
+// Draws part of the paper: the picture stretched over the whole paper. Neither has alpha; both hold 32 bits a pixel.
 void drawStretched(Bitmap& paper, const Bitmap& picture, const QRect& part);
 
-// The strongest scaled decode (1, 2, 4 or 8) that still leaves at least twice the pixels wanted: nearer than that,
-// quality suffers.
+// The largest denominator of a scaled decode (1, 2, 4 or 8) that leaves at least twice the wanted size a side; with
+// fewer pixels quality suffers.
 int decodeDenominator(PictureSize source, PictureSize wanted);
 
-// The reader's picture in size; from plane to plane, without whole pixels, where the file allows it. The reader is used
-// up.
+// The reader's picture scaled to size, plane by plane where the file allows it. One call uses the reader up.
 Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const ResampleKernels& kernels = bestKernels());
 Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRect& part,
                                  const ResampleKernels& kernels = bestKernels());

@@ -1,10 +1,10 @@
 #include "imaging/scaling/ResampleKernels.h"
 
-// This file is compiled once for each vector width.
+// Highway compiles this file once for each instruction set.
 #undef HWY_TARGET_INCLUDE
 #define HWY_TARGET_INCLUDE "imaging/scaling/ResampleKernels.cpp"
 #include "hwy/foreach_target.h"
-// Behind it, not before.
+// highway.h must stand behind foreach_target.h.
 #include "hwy/highway.h"
 
 #include <cstring>
@@ -14,7 +14,7 @@ namespace lumora::HWY_NAMESPACE {
 
 #if HWY_TARGET == HWY_SCALAR
 
-// No vectors at all: the least that this kind of machine must have.
+// A machine without vectors uses the plain kernels.
 ResampleKernels Table() {
     return plainKernels();
 }
@@ -34,7 +34,7 @@ HWY_INLINE hn::Vec<D16> pairOf(D16 d16, const std::int16_t* weights) {
     return hn::BitCast(d16, hn::Set(d32, both));
 }
 
-// sum + the products of neighbouring lanes, added in pairs.
+// sum plus the products of neighbouring lanes, added in pairs.
 template <class D32, class V16>
 HWY_INLINE hn::Vec<D32> addProducts(D32 d32, V16 samples, V16 weights, hn::Vec<D32> sum) {
     hn::Vec<D32> rest = hn::Zero(d32);
@@ -65,7 +65,7 @@ void BlendRows(const std::uint8_t* const* HWY_RESTRICT source, const std::int16_
             sum2 = addProducts(d32, hn::BitCast(d16, hn::InterleaveLower(d8, right, none)), pair, sum2);
             sum3 = addProducts(d32, hn::BitCast(d16, hn::InterleaveUpper(d8, right, none)), pair, sum3);
         }
-        // Interleaving and packing both work within 16 bytes, so that these are in order there.
+        // Interleaving and packing both work within 16 bytes, which restores the order there.
         const auto left = hn::ReorderDemote2To(d16, hn::ShiftRight<8>(sum0), hn::ShiftRight<8>(sum1));
         const auto right = hn::ReorderDemote2To(d16, hn::ShiftRight<8>(sum2), hn::ShiftRight<8>(sum3));
         if constexpr (step == 32) {
@@ -103,7 +103,7 @@ void PackColumns(const std::int16_t* HWY_RESTRICT source, std::ptrdiff_t stride,
     }
 }
 
-// Eight columns of eight bytes to eight rows of eight bytes.
+// Turns eight columns of eight bytes into eight rows of eight bytes.
 HWY_INLINE void turnBlock(const std::uint8_t* HWY_RESTRICT columns, std::uint8_t* HWY_RESTRICT target,
                           std::ptrdiff_t stride) {
     const hn::Full128<std::uint8_t> d8;

@@ -26,7 +26,7 @@ HostPath normal(const HostPath& path) {
     return absolute.has_filename() || absolute == absolute.root_path() ? absolute : absolute.parent_path();
 }
 
-// What lies below folder on the way to path, or no value when path lies elsewhere.
+// The names from folder down to path; no value when path lies elsewhere.
 std::optional<std::vector<HostPath>> below(const HostPath& folder, const HostPath& path) {
     const auto [inFolder, inPath] = std::mismatch(folder.begin(), folder.end(), path.begin(), path.end());
     if (inFolder != folder.end())
@@ -34,7 +34,7 @@ std::optional<std::vector<HostPath>> below(const HostPath& folder, const HostPat
     return std::vector<HostPath>(inPath, path.end());
 }
 
-// An empty folder that nothing is mounted on is the place of a medium that is not there.
+// An empty folder that nothing is mounted on belongs to a medium that is not there.
 bool holdsMedium(const HostPath& folder) {
     struct stat here {};
     struct stat above {};
@@ -124,7 +124,7 @@ void Drives::refreshMedia() {
         if (known)
             continue;
         // A medium that was taken out keeps its letter: cards number their pictures alike, and a path of the first card
-        // must never lead to a picture of the second. Only when all letters are gone are those given anew.
+        // must not lead to a picture of the second. Letters are given again only when none is left.
         if (!takeLetter(folder)) {
             std::erase_if(m_media, isGone);
             takeLetter(folder);
@@ -166,7 +166,7 @@ std::optional<HostPath> Drives::toHost(const QString& drivePath) const {
         return std::nullopt;
 
     QString rest = drivePath.mid(2);
-    // Two folders of the editor are spelt with a slash.
+    // Two folder names of the editor are written with a slash.
     rest.replace(u'/', u'\\');
     std::vector<QString> names;
     for (const QString& name : rest.split(u'\\', Qt::SkipEmptyParts)) {

@@ -12,14 +12,14 @@
 
 namespace lumora {
 
-// The drive letters that the system speaks of, and the folders of this machine that stand behind them: the program's
-// own letter (C: unless the deployment says otherwise) is the data folder, Z: is the root of the file system, and
-// mounted media take the free letters from D: on, so that a memory card shows as a drive.
+// The drive letters and the folders of this machine behind them. The program's letter (C: by default) is the data
+// folder, Z: the root of the file system; mounted media take the free letters from D: on, so that a memory card shows
+// as a drive.
 class Drives {
 public:
-    // mediaRoots: folders whose sub-folders are mounted media, as /media/<user>/CARD and /run/media/<user>/CARD. A
-    // medium that appears twice takes one letter; a medium keeps its letter, also when it is taken out meanwhile.
-    // offeredFirst: letters of the drives that drives() puts in front, in this order.
+    // mediaRoots: folders whose sub-folders are mounted media, as /media/<user> and /run/media/<user>. A medium that is
+    // mounted twice has one letter; a medium that is taken out keeps its letter. offeredFirst: letters that drives()
+    // lists first, in this order.
     Drives(HostPath dataFolder, QChar programLetter = u'C', std::vector<HostPath> mediaRoots = defaultMediaRoots(),
            QString offeredFirst = {});
 
@@ -28,28 +28,28 @@ public:
     static HostPath defaultDataFolder();
 
     QChar programLetter() const { return m_programLetter; }
-    // "C:\": the root of all workspace paths.
+    // As "C:\": the root of all workspace paths.
     QString programRoot() const;
     const HostPath& dataFolder() const { return m_dataFolder; }
 
-    // Looks for media that came or went since the last call.
+    // Looks for media that were mounted or removed since the last call.
     void refreshMedia();
 
     struct Drive {
         QChar letter;
         HostPath folder;
-        QString name; // what a person calls it: the medium's label, or the folder's name
+        QString name; // the medium's label, or the folder's name
         bool removable;
         bool offeredFirst;
     };
     std::vector<Drive> drives() const;
 
     // No value for a text without a drive letter, for a letter without a folder, and for a path that leaves its drive
-    // by "..". A long leaf name is shortened by the rule of ShortenedName, the same at each call.
+    // by "..". A long leaf name is shortened as by ShortenedName.
     std::optional<HostPath> toHost(const QString& drivePath) const;
 
-    // The drive path with the deepest matching drive; Z: serves for what lies on no other. Names of bytes that are no
-    // UTF-8 keep their bytes: they come back from toHost as they were.
+    // The drive path below the deepest folder that has a letter; Z: for a path below no other. A name that is not UTF-8
+    // comes back from toHost unchanged.
     QString toDrive(const HostPath& hostPath) const;
 
 private:
@@ -60,9 +60,9 @@ private:
     std::map<QChar, HostPath> m_media;
 };
 
-// A file name may have 255 bytes here, and a flat name made of a whole path in Hebrew takes two bytes a letter. A
-// longer name is cut and closed with "~" and eight hexadecimal digits of a checksum of the whole, before its ending of
-// up to five characters, so that two names that differ stay different.
+// A file name may have 255 bytes on this machine, and a leaf name made of a whole Hebrew path takes two bytes a letter.
+// A longer name is cut; "~" and eight hexadecimal digits of a checksum of the whole name follow, then its ending of up
+// to five characters. So different names stay different.
 QString ShortenedName(const QString& name);
 
 } // namespace lumora

@@ -13,14 +13,14 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-// No file that is read whole comes near; what is larger was not meant.
+// No file of the program comes near; a larger one is an error.
 constexpr qint64 largestRead = qint64(1) << 30;
 
 Failure failure(Failure::Kind kind, const QString& path, const QString& reason) {
     return {kind, QStringLiteral("%1: %2").arg(path, reason)};
 }
 
-// "*" any run of characters, "?" any one.
+// In a pattern "*" stands for any characters, "?" for one.
 bool matches(QStringView pattern, QStringView name) {
     qsizetype p = 0;
     qsizetype n = 0;
@@ -60,7 +60,7 @@ void sortWithoutCase(QStringList& names) {
 
 enum class Wanted { Files, Folders };
 
-// Names as they are, not yet squeezed into the code page. Hidden ones are left out.
+// The names before conversion to the code page; hidden ones are left out.
 QStringList entries(const HostPath& folder, Wanted wanted, std::error_code& error) {
     QStringList names;
     for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
@@ -90,7 +90,7 @@ void collectInto(QStringList& all, const HostPath& folder, const QString& shown,
         return;
     for (const QString& name : entries(folder, Wanted::Folders)) {
         const HostPath sub = folder / toHostPath(name);
-        // A link may lead back up, and the walk would never end.
+        // A link may lead back to a folder above, and the walk would not end.
         if (!fs::is_symlink(sub))
             collectInto(all, sub, shown + u'\\' + AnsiCodePage::squeeze(name), depth, unreadable);
     }

@@ -9,7 +9,7 @@
 
 namespace lumora {
 
-// Files and folders under drive paths. A failure's message names the path and the reason. Folders are made with mode
+// Files and folders under drive paths. The message of a failure holds the path and the reason. Folders get the mode
 // 0700, since the workspace holds customers' personal data.
 class Files {
 public:
@@ -18,53 +18,50 @@ public:
 
     const Drives& drives() const { return m_drives; }
 
-    // A path that holds a "?" counts as absent, here and in every call below: the "?" is what a character outside the
-    // code page has become.
+    // A path with "?" counts as absent in all calls: "?" replaces a character outside the code page.
     bool fileExists(const QString& path) const;
     bool folderExists(const QString& path) const;
 
-    // An existing folder is success. The parent must exist.
+    // Succeeds when the folder exists. The parent must exist.
     Result<void> makeFolder(const QString& path) const;
     Result<void> removeFile(const QString& path) const;
 
     Result<QByteArray> read(const QString& path) const;
 
-    // To a temporary file in the same folder, synced, then renamed: a crash or a full disk leaves the old file or the
-    // new one and never half a file.
+    // Writes a temporary file in the same folder, syncs and renames it: after a crash or on a full disk the path holds
+    // the old file or the new one, never part of one.
     Result<void> writeWhole(const QString& path, const QByteArray& bytes) const;
 
-    // The same without waiting for the disk: for files that are written at every touch and that nothing needs after a
-    // crash of the machine.
+    // The same without the sync, for files written at every touch that are not needed after a crash of the machine.
     Result<void> writePassing(const QString& path, const QByteArray& bytes) const;
 
-    // Copies whole, in the same way. The source is opened for reading only.
+    // Copies by the same way. The source is opened for reading only.
     Result<void> copyFile(const QString& source, const QString& target) const;
 
     Result<qint64> size(const QString& path) const;
 
-    // Leaf names of the files that match one of the patterns, joined by ";" ("*.gbr;*.jpp"); "*.*" and "*" match every
-    // name. Letter case does not count. Hidden files (a leading dot) and folders are left out. Sorted by name without
-    // regard to case, "!" before digits before letters. A name with a character outside the code page comes with "?" in
-    // its place. A folder that is missing or may not be read gives no names.
+    // Leaf names of the files that match one of the patterns, separated by ";" ("*.gbr;*.jpp"); "*.*" and "*" match
+    // all. Letter case does not count. Hidden files (a leading dot) and folders are left out. Sorted without regard to
+    // case, "!" before digits before letters. A character outside the code page is "?". Empty when the folder can't be
+    // read.
     QStringList names(const QString& folder, const QString& patterns) const;
 
-    // Leaf names of the sub-folders, sorted in the same way.
+    // Leaf names of the sub-folders, sorted likewise.
     QStringList folders(const QString& folder) const;
 
-    // folder + "\" + name for each file. unreadable takes a line for each folder that may not be read; without it those
-    // are passed over.
+    // folder + "\" + name for each file. Folders that can't be read are skipped and appended to unreadable, if given.
     enum class Depth { ThisFolder, WithSubfolders };
     QStringList collect(const QString& folder, Depth depth, QStringList* unreadable = nullptr) const;
 
-    // The place on this machine, for who reads or writes a file in parts.
+    // The path on this machine, for reading or writing parts of a file.
     Result<HostPath> host(const QString& path) const;
 
 private:
     const Drives& m_drives;
 };
 
-// The working file list of a page: a folder and a pattern, and a snapshot of the matching names that stays as it is
-// until the folder or the pattern is set or refresh is called.
+// The file list of a page: the names in a folder that match a pattern, read when the folder or the pattern is set and
+// by refresh().
 class FileList {
 public:
     explicit FileList(const Files& files, QString pattern = QStringLiteral("*.*"))

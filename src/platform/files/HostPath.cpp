@@ -5,9 +5,9 @@
 namespace lumora {
 namespace {
 
-// A name here is bytes, and a camera's card may hold names that are no UTF-8. Such a byte travels as the lone low
-// surrogate U+DC00 + byte, which no valid text holds, so that the way back gives the same bytes. In the code page it
-// becomes a "?". A backslash inside a name travels in the same way, since in a drive path it would part two names.
+// A file name is bytes, which on a camera's card need not be UTF-8. Each such byte becomes the lone low surrogate
+// U+DC00 + byte, which no valid text holds, so that the conversion back gives the same bytes. A backslash in a name is
+// converted likewise, since it separates the names of a drive path. The code page has "?" for both.
 constexpr char16_t escapeBase = 0xDC00;
 constexpr char16_t escapedBackslash = escapeBase + u'\\';
 

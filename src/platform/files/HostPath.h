@@ -6,17 +6,15 @@
 
 namespace lumora {
 
-// A path of this machine. A drive path ("C:\pictures\a.jpg") is a QString; the two types do not mix, and only Drives
-// turns one into the other.
+// A path of this machine. Only Drives converts between it and a drive path ("C:\pictures\a.jpg").
 using HostPath = std::filesystem::path;
 
-// The path as text, and back. Bytes that are no UTF-8 survive the way there and back as lone surrogates; in the code
-// page each of them becomes a "?".
+// The path as text and back. Bytes that are not UTF-8 become lone surrogates and return unchanged; the code page has
+// "?" for each.
 QString toText(const HostPath& path);
 HostPath toHostPath(const QString& text);
 
-// One name of a path as it stands in a drive path: a backslash inside the name, which would part it in two there, is
-// carried like a byte that is no UTF-8.
+// One name of a path as it stands in a drive path: a backslash in it is converted like a byte that is not UTF-8.
 QString toDriveName(const HostPath& name);
 
 } // namespace lumora

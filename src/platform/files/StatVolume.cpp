@@ -10,7 +10,7 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-// The data folder may not have been made yet; the folder that it will be made in lies on the same file system.
+// The data folder may not exist yet; its nearest existing parent lies on the same file system.
 HostPath nearestExisting(HostPath folder) {
     struct stat status {};
     while (::stat(folder.c_str(), &status) != 0 && errno == ENOENT && folder != folder.root_path())

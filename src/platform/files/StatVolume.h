@@ -5,9 +5,9 @@
 
 namespace lumora {
 
-// The serial of the file system that a drive's folder lies on. A FAT medium gives the serial that it was formatted
-// with, another file system a checksum of its UUID, both the same at every mount. Where the UUID can't be seen (a
-// container, a network share), the file system's own id serves, or else the number of its device.
+// The serial of the file system on which a drive's folder lies, the same at every mount: the serial of a FAT medium,
+// else a checksum of the UUID. Where the UUID is not visible (a container, a network share), the file system's id, or
+// else its device number.
 class StatVolume : public Volume {
 public:
     explicit StatVolume(const Drives& drives, HostPath uuidLinks = "/dev/disk/by-uuid")
@@ -18,11 +18,10 @@ public:
 
 private:
     const Drives& m_drives;
-    HostPath m_uuidLinks; // links named by UUID to block devices
+    HostPath m_uuidLinks; // folder of links from UUIDs to block devices
 };
 
-// The serial for a UUID as the links have it: "ABCD-1234" of a FAT medium is the number itself, any other text gives
-// its checksum.
+// The serial of a UUID as the links name it: "ABCD-1234" of a FAT medium as a number, a checksum of any other text.
 std::int32_t serialOfUuid(const QString& uuid);
 
 } // namespace lumora
