@@ -11,13 +11,18 @@ namespace lumora {
 struct CaptionText {
     Caption& caption;
     const char16_t* hebrew;
-    const char16_t* english;
+    const char16_t* english = hebrew;     // where it is left out, the same in both
+    const char16_t* hebrewHint = nullptr; // where both are left out, the hint stays as it is
+    const char16_t* englishHint = hebrewHint;
 };
 
-// Every caption of the table says its text in the language of the session.
+// Every caption of the table says its text and its hint in the language of the session.
 inline void setCaptions(const SessionState& state, std::initializer_list<CaptionText> texts) {
-    for (const CaptionText& text : texts)
+    for (const CaptionText& text : texts) {
         text.caption.text = state.wording(text.hebrew, text.english);
+        if (text.hebrewHint != nullptr)
+            text.caption.hint = state.wording(text.hebrewHint, text.englishHint);
+    }
 }
 
 } // namespace lumora

@@ -11,6 +11,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
+#include "session/CaptionTexts.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
@@ -42,18 +43,19 @@ void B3::load() {
 }
 
 void B3::setTexts() {
-    const SessionState& s = m_state;
-    Label4Title.text = s.wording(u"הכנת תמונות למשלוח", u"Preparing your pictures");
+    setCaptions(m_state, {
+                             {Label4Title, u"הכנת תמונות למשלוח", u"Preparing your pictures"},
+                             {Command1, u"הסר תמונה זו מהרשימה", u"Remove this picture from the list"},
+                             {Command5, u"הכן את ההזמנה", u"Prepare the order"},
+                             // The same button in the two languages of the page.
+                             {Command2, u" Stop All and EXIT"},
+                             {Command7, u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program"},
+                             {Picture5, u"דף ההזמנה", u"Order sheet"},
+                         });
+    Command2.visible = m_state.english();
+    Command7.visible = !m_state.english();
     Label1.text = doNotDelete();
     Label2.text = untilPrinted();
-    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
-    Command5.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
-    // The same button in the two languages of the page.
-    Command2.text = QStringLiteral(" Stop All and EXIT");
-    Command2.visible = m_state.english();
-    Command7.text = s.wording(u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program");
-    Command7.visible = !m_state.english();
-    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
     showProgress();
     Q_EMIT changed();
 }

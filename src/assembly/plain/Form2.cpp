@@ -10,6 +10,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
+#include "session/CaptionTexts.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
@@ -89,18 +90,19 @@ void Form2::load() {
 }
 
 void Form2::setTexts() {
-    const SessionState& s = m_state;
-    Label1.text = s.wording(u"מארז תמונות", u"Preparing your pictures");
+    setCaptions(m_state, {
+                             {Label1, u"מארז תמונות", u"Preparing your pictures"},
+                             {Command1, u"הסר תמונה זו מהרשימה", u"Remove this picture from the list"},
+                             {Command3, u"הכן את ההזמנה", u"Prepare the order"},
+                             {Command4, u"הצג דף אלבום", u"Show the album sheet"},
+                             {Command5, u"צייר שוב את התמונות", u"Draw the pictures again"},
+                             {Command6, u"הכן את ההזמנה עכשיו", u"Prepare the order now"},
+                             {Command7, u"EXIT  יציאה", u"EXIT"},
+                             {Command8, u"החזר את הדף למקומו", u"Put the sheet back"},
+                             {Picture5, u"דף ההזמנה", u"Order sheet"},
+                         });
     Label6.text = doNotDelete();
     Label10.text = untilPrinted();
-    Command1.text = s.wording(u"הסר תמונה זו מהרשימה", u"Remove this picture from the list");
-    Command3.text = s.wording(u"הכן את ההזמנה", u"Prepare the order");
-    Command4.text = s.wording(u"הצג דף אלבום", u"Show the album sheet");
-    Command5.text = s.wording(u"צייר שוב את התמונות", u"Draw the pictures again");
-    Command6.text = s.wording(u"הכן את ההזמנה עכשיו", u"Prepare the order now");
-    Command7.text = s.wording(u"EXIT  יציאה", u"EXIT");
-    Command8.text = s.wording(u"החזר את הדף למקומו", u"Put the sheet back");
-    Picture5.text = s.wording(u"דף ההזמנה", u"Order sheet");
     showProgress();
     Q_EMIT changed();
 }

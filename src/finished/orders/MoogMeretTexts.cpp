@@ -3,44 +3,46 @@
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"
 #include "order/OrderNames.h"
+#include "session/CaptionTexts.h"
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
 void MoogMeret::setTexts() {
-    const auto set = [this](Caption& control, const QString& hebrew, const QString& english) {
-        control.text = m_state.wording(hebrew, english);
-    };
-    set(Title, u"משלוח הזמנות מוגמרות"_s, u"Sending finished orders"_s);
-    set(Label4Shalav1, u"שלב ראשון: איזו הזמנה לשלוח?"_s, u"Step one: which order?"_s);
-    set(Label4Rek, u"אין במחשב זה הזמנות מוגמרות."_s, u"There are no finished orders on this computer."_s);
-    set(Label4Bhar, u"נגיעה בהזמנה מציגה את הקבצים שלה."_s, u"Touch an order to see its files."_s);
-    set(Label4Shalav2, u"שלב שני: אילו קבצים לשלוח? נגיעה בשורה מסמנת קובץ או מבטלת סימון."_s,
-        u"Step two: which files? A touch marks a file, or takes its mark away."_s);
-    set(Label4Files, u"קבצים בהזמנה"_s, u"files in this order"_s);
-    set(Label4Prints, u"תמונות בקבצים שסומנו"_s, u"pictures in the marked files"_s);
-    set(Label4Reka, u"אין בהזמנה זו קבצים לשליחה."_s, u"This order has no files that can be sent."_s);
-    set(Label4Tmuna, u"תצוגה של הקובץ הראשון"_s, u"A look at the first file"_s);
-    set(Label4Shalav3, u"שלב שלישי: איך לשלוח?"_s, u"Step three: how to send?"_s);
-    set(Command1, u"בחר את כל הקבצים למשלוח"_s, u"Choose all the files"_s);
-    set(Command21, u"בטל את כל הבחירה"_s, u"Cancel the whole choice"_s);
-    set(Command4, u"   בצע משלוח"_s, u"   Send now"_s);
-    set(Command2, u"שלח בדואר אלקטרוני"_s, u"Send by e-mail"_s);
-    set(Command5, u"רענן רשימת הזמנות"_s, u"Refresh the list"_s);
-    set(Command6, u"בטל הכל וצא מהתוכנה"_s, u"Cancel all and leave the program"_s);
-    set(Command28, u"הזמנה חדשה"_s, u"New order"_s);
-    set(Command4Orders, u"חזרה לרשימת ההזמנות"_s, u"Back to the orders"_s);
-    set(Command4Pieces, u"חיתוך ואיחוד קבצים"_s, u"Cut and join files"_s);
-    set(Command13, u"שלח לפ י שיטה 1"_s, u"Send by method 1"_s);
-    set(Command18, u"Exit  יציאה"_s, u"Exit"_s);
-    set(Command19, u"עצור משלוח"_s, u"Stop sending"_s);
-    set(Label9, u"המשלוח חולק לחלקים קטנים"_s, u"The sending was cut into small parts"_s);
-    set(Label2, u"התמונות ארוזות למשלוח והן תשלחנה ב"_s, u"The pictures are packed for sending and will go in"_s);
-    set(Label3, u"מנות"_s, u"packages"_s);
-    set(Label4Dakot, u"דקות במנה זו:"_s, u"Minutes on this package:"_s);
-    set(Label24, u"לחצן יציאה יהיה פעיל לאחר משלוח כל המנות"_s,
-        u"The exit button will work after all the packages are sent"_s);
+    setCaptions(
+        m_state,
+        {
+            {Title, u"משלוח הזמנות מוגמרות", u"Sending finished orders"},
+            {Label4Shalav1, u"שלב ראשון: איזו הזמנה לשלוח?", u"Step one: which order?"},
+            {Label4Rek, u"אין במחשב זה הזמנות מוגמרות.", u"There are no finished orders on this computer."},
+            {Label4Bhar, u"נגיעה בהזמנה מציגה את הקבצים שלה.", u"Touch an order to see its files."},
+            {Label4Shalav2, u"שלב שני: אילו קבצים לשלוח? נגיעה בשורה מסמנת קובץ או מבטלת סימון.",
+             u"Step two: which files? A touch marks a file, or takes its mark away."},
+            {Label4Files, u"קבצים בהזמנה", u"files in this order"},
+            {Label4Prints, u"תמונות בקבצים שסומנו", u"pictures in the marked files"},
+            {Label4Reka, u"אין בהזמנה זו קבצים לשליחה.", u"This order has no files that can be sent."},
+            {Label4Tmuna, u"תצוגה של הקובץ הראשון", u"A look at the first file"},
+            {Label4Shalav3, u"שלב שלישי: איך לשלוח?", u"Step three: how to send?"},
+            {Command1, u"בחר את כל הקבצים למשלוח", u"Choose all the files"},
+            {Command21, u"בטל את כל הבחירה", u"Cancel the whole choice"},
+            {Command4, u"   בצע משלוח", u"   Send now"},
+            {Command2, u"שלח בדואר אלקטרוני", u"Send by e-mail"},
+            {Command5, u"רענן רשימת הזמנות", u"Refresh the list"},
+            {Command6, u"בטל הכל וצא מהתוכנה", u"Cancel all and leave the program"},
+            {Command28, u"הזמנה חדשה", u"New order"},
+            {Command4Orders, u"חזרה לרשימת ההזמנות", u"Back to the orders"},
+            {Command4Pieces, u"חיתוך ואיחוד קבצים", u"Cut and join files"},
+            {Command13, u"שלח לפ י שיטה 1", u"Send by method 1"},
+            {Command18, u"Exit  יציאה", u"Exit"},
+            {Command19, u"עצור משלוח", u"Stop sending"},
+            {Label9, u"המשלוח חולק לחלקים קטנים", u"The sending was cut into small parts"},
+            {Label2, u"התמונות ארוזות למשלוח והן תשלחנה ב", u"The pictures are packed for sending and will go in"},
+            {Label3, u"מנות", u"packages"},
+            {Label4Dakot, u"דקות במנה זו:", u"Minutes on this package:"},
+            {Label24, u"לחצן יציאה יהיה פעיל לאחר משלוח כל המנות",
+             u"The exit button will work after all the packages are sent"},
+        });
     showWhatIsMarked();
     showWalk();
     showOutcome();

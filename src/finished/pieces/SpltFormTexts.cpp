@@ -2,6 +2,7 @@
 #include "common/DrivePathText.h"
 #include "finished/pieces/SpltForm.h"
 #include "order/PieceName.h"
+#include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -13,38 +14,32 @@ QString SpltForm::wording(const QString& hebrew, const QString& english) const {
 }
 
 void SpltForm::setTexts() {
-    const auto set = [this](Caption& control, const QString& hebrew, const QString& english) {
-        control.text = wording(hebrew, english);
-    };
-    const auto hint = [this](Caption& control, const QString& hebrew, const QString& english) {
-        control.hint = wording(hebrew, english);
-    };
-    set(Title, u"חיתוך קבצים לחלקים וצירופם"_s, u"Cutting files into pieces and joining them"_s);
-    set(Label4Cut, u"לחתוך"_s, u"Cut"_s);
-    set(Label4Join, u"לצרף"_s, u"Join"_s);
-    set(Label4files, u"הקבצים לחיתוך"_s, u"Files to cut"_s);
-    set(Label4Bodedim, u"משפחות"_s, u"Families"_s);
-    set(Label4Famely, u"חלקי המשפחה שנבחרה"_s, u"Pieces of the chosen family"_s);
-    set(Label4Chalakim, u"כל הקבצים שנקראו"_s, u"All the files read"_s);
-    set(Label4Text2, u"גודל חלק, בבתים"_s, u"Size of a piece, in bytes"_s);
-    set(Label4Idle, u"בחרו תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים."_s,
-        u"Choose a folder to cut, or a folder of pieces to join. The files themselves never change."_s);
-    Command1.text = u"MergeAll"_s;
-    set(Command2, u"בחר תיקייה לחיתוך"_s, u"Choose a folder to cut"_s);
-    Command3.text = u"Split All"_s;
-    Command4.text = u"Merge"_s;
-    Command5.text = u"Find Famely"_s;
-    Command6.text = u"Filelen"_s;
-    set(Command8, u"קרא תיקיית חלקים"_s, u"Read a folder of pieces"_s);
-    Command9.text = u"splitOne"_s;
-    set(Command15, u"עצור"_s, u"Stop"_s);
-    set(Image3, u"חזרה להזמנות המוגמרות"_s, u"Back to the finished orders"_s);
-    hint(Command3, u"חותך את כל קובצי jpp שברשימה"_s, u"Cuts all the jpp files of the list"_s);
-    hint(Command9, u"חותך קובץ prk אחד"_s, u"Cuts one prk file"_s);
-    hint(Command1, u"מצרף את כל המשפחות השלמות"_s, u"Joins all the complete families"_s);
-    hint(Command4, u"מצרף את המשפחה שנבחרה, גם אם אינה שלמה"_s,
-         u"Joins the chosen family, even if it is not complete"_s);
-    hint(Command6, u"אורך הקובץ שנבחר"_s, u"Length of the chosen file"_s);
+    setCaptions(
+        m_state,
+        {
+            {Title, u"חיתוך קבצים לחלקים וצירופם", u"Cutting files into pieces and joining them"},
+            {Label4Cut, u"לחתוך", u"Cut"},
+            {Label4Join, u"לצרף", u"Join"},
+            {Label4files, u"הקבצים לחיתוך", u"Files to cut"},
+            {Label4Bodedim, u"משפחות", u"Families"},
+            {Label4Famely, u"חלקי המשפחה שנבחרה", u"Pieces of the chosen family"},
+            {Label4Chalakim, u"כל הקבצים שנקראו", u"All the files read"},
+            {Label4Text2, u"גודל חלק, בבתים", u"Size of a piece, in bytes"},
+            {Label4Idle, u"בחרו תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים.",
+             u"Choose a folder to cut, or a folder of pieces to join. The files themselves never change."},
+            {Command1, u"MergeAll", u"MergeAll", u"מצרף את כל המשפחות השלמות", u"Joins all the complete families"},
+            {Command2, u"בחר תיקייה לחיתוך", u"Choose a folder to cut"},
+            {Command3, u"Split All", u"Split All", u"חותך את כל קובצי jpp שברשימה",
+             u"Cuts all the jpp files of the list"},
+            {Command4, u"Merge", u"Merge", u"מצרף את המשפחה שנבחרה, גם אם אינה שלמה",
+             u"Joins the chosen family, even if it is not complete"},
+            {Command5, u"Find Famely"},
+            {Command6, u"Filelen", u"Filelen", u"אורך הקובץ שנבחר", u"Length of the chosen file"},
+            {Command8, u"קרא תיקיית חלקים", u"Read a folder of pieces"},
+            {Command9, u"splitOne", u"splitOne", u"חותך קובץ prk אחד", u"Cuts one prk file"},
+            {Command15, u"עצור", u"Stop"},
+            {Image3, u"חזרה להזמנות המוגמרות", u"Back to the finished orders"},
+        });
     showCounts();
     Q_EMIT changed();
 }

@@ -115,7 +115,6 @@ public:
 
 private:
     enum class Guide { None, PicturesShown, ChooseByHand };
-    struct Words;
 
     void say(const char16_t* hebrew, const char16_t* english);
     void showChoice();
@@ -180,7 +179,6 @@ private:
     void goOnWithoutAddress();
     void handOver(const QString& mail);
 
-    void setWords(std::initializer_list<Words> all);
     void setBrowserTexts();
     void setClosingTexts();
 

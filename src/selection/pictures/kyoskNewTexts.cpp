@@ -1,26 +1,12 @@
 // All texts of the page of pictures, in both languages.
 #include "selection/pictures/kyoskNew.h"
+#include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 #include "session/lab/MailDomains.h"
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-struct kyoskNew::Words {
-    Caption& caption;
-    const char16_t* hebrew;
-    const char16_t* english;
-    const char16_t* hebrewHint = u"";
-    const char16_t* englishHint = u"";
-};
-
-void kyoskNew::setWords(std::initializer_list<Words> all) {
-    for (const Words& words : all) {
-        words.caption.text = m_state.wording(words.hebrew, words.english);
-        words.caption.hint = m_state.wording(words.hebrewHint, words.englishHint);
-    }
-}
 
 void kyoskNew::setTexts() {
     setBrowserTexts();
@@ -36,51 +22,53 @@ void kyoskNew::setTexts() {
 void kyoskNew::setBrowserTexts() {
     Label15.text = Label18.text = m_state.shemot.ppr;
     if (plain())
-        setWords({{Title, u"בחירת תמונות", u"Choose your pictures"}});
+        setCaptions(m_state, {{Title, u"בחירת תמונות", u"Choose your pictures"}});
     else
-        setWords({{Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it"}});
-    setWords({
-        {Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
-         u"Your pictures will show here\nPress Add pictures and select one picture of the folder"},
-        {Label7Prompt, u"עותקים", u"Copies"},
-        {Label34Prompt, u"תמונות בתיקייה", u"Pictures found"},
-        {Label25, u"זכור\nעליך לבחור רק תמונה אחת\nוהתוכנה תציג את כל התמונות ",
-         u"Please Be Note\nSelect one image only\nand the program will Show \nall the Chocen Folder Images"},
-        {Image4, u"סובב", u"Turn", u"סובב את התצוגה. ההדפסה אינה משתנה",
-         u"Turns the view only; the print does not change"},
-        {Image5, u"הוסף תמונות", u"Add pictures", u"הוסף תמונות מתיקייה נוספת",
-         u"Adds the pictures of a further folder"},
-        {Image6, u"עזרה", u"Help"},
-        {Image7, u"סיים ושלח", u"Finish Order And Send"},
-        {Image8, u"בטל בחירה בדף זה", u"Cancel this page", u"מבטל את כל התמונות שנבחרו בדף זה",
-         u"Cancels all pictures chosen on this page"},
-        {Image10, u"יציאה", u"Leave"},
-        {Image11, u"מחירון", u"Price list"},
-        {Image13, u"סיים ושלח", u"Finish Order And Send", u"סיום הזמנת האלבום", u"Finishes the album order"},
-        {Image15, u"הקודמות", u"Previous", u"תמונות קודמות", u"Previous pictures"},
-        {Image16, u"הבאות", u"Next", u"תמונות הבאות", u"Next pictures"},
-        {Image17, u"מחירון", u"Price list"},
-        {Image23, u"סגור את התוכנה", u"End the program"},
-        {Command11, u"הסר כפילויות", u"Drop duplicates", u"תמונה שנבחרה פעמיים תופיע פעם אחת",
-         u"A picture that stands twice in the basket will stand once"},
-        {Command14, u"הצג רק מה שנבחר", u"Show only what was chosen"},
-        {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
-        {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
-        {Frame2, u"עזרה", u"Help"},
-        {helpClose, u"סגור", u"Close"},
-        {Picture66, u"שליחת תיקייה שלמה", u"Send a whole folder"},
-        {Label35, u"האם לשלוח את כל התיקייה?", u"Send the whole folder?"},
-        {Label36, u"בחר כאן כיצד להמשיך", u"Choose here how to go on"},
-        {Command24, u"מעוניין לשלוח את כל התיקייה במלואה", u"I want to send the whole folder"},
-        {Command25, u"לא את כל התיקייה, אבחר בעצמי", u"Not all of it, I will choose"},
-        {Command23, u"התחרטתי רוצה לשלוח תיקייה אחרת ", u"Changed my mind, I want another folder"},
-        {Command26[0], u"כן", u"Yes"},
-        {Command26[1], u"לא", u"No"},
-    });
+        setCaptions(m_state, {{Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it"}});
+    setCaptions(
+        m_state,
+        {
+            {Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
+             u"Your pictures will show here\nPress Add pictures and select one picture of the folder"},
+            {Label7Prompt, u"עותקים", u"Copies"},
+            {Label34Prompt, u"תמונות בתיקייה", u"Pictures found"},
+            {Label25, u"זכור\nעליך לבחור רק תמונה אחת\nוהתוכנה תציג את כל התמונות ",
+             u"Please Be Note\nSelect one image only\nand the program will Show \nall the Chocen Folder Images"},
+            {Image4, u"סובב", u"Turn", u"סובב את התצוגה. ההדפסה אינה משתנה",
+             u"Turns the view only; the print does not change"},
+            {Image5, u"הוסף תמונות", u"Add pictures", u"הוסף תמונות מתיקייה נוספת",
+             u"Adds the pictures of a further folder"},
+            {Image6, u"עזרה", u"Help"},
+            {Image7, u"סיים ושלח", u"Finish Order And Send"},
+            {Image8, u"בטל בחירה בדף זה", u"Cancel this page", u"מבטל את כל התמונות שנבחרו בדף זה",
+             u"Cancels all pictures chosen on this page"},
+            {Image10, u"יציאה", u"Leave"},
+            {Image11, u"מחירון", u"Price list"},
+            {Image13, u"סיים ושלח", u"Finish Order And Send", u"סיום הזמנת האלבום", u"Finishes the album order"},
+            {Image15, u"הקודמות", u"Previous", u"תמונות קודמות", u"Previous pictures"},
+            {Image16, u"הבאות", u"Next", u"תמונות הבאות", u"Next pictures"},
+            {Image17, u"מחירון", u"Price list"},
+            {Image23, u"סגור את התוכנה", u"End the program"},
+            {Command11, u"הסר כפילויות", u"Drop duplicates", u"תמונה שנבחרה פעמיים תופיע פעם אחת",
+             u"A picture that stands twice in the basket will stand once"},
+            {Command14, u"הצג רק מה שנבחר", u"Show only what was chosen"},
+            {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
+            {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
+            {Frame2, u"עזרה", u"Help"},
+            {helpClose, u"סגור", u"Close"},
+            {Picture66, u"שליחת תיקייה שלמה", u"Send a whole folder"},
+            {Label35, u"האם לשלוח את כל התיקייה?", u"Send the whole folder?"},
+            {Label36, u"בחר כאן כיצד להמשיך", u"Choose here how to go on"},
+            {Command24, u"מעוניין לשלוח את כל התיקייה במלואה", u"I want to send the whole folder"},
+            {Command25, u"לא את כל התיקייה, אבחר בעצמי", u"Not all of it, I will choose"},
+            {Command23, u"התחרטתי רוצה לשלוח תיקייה אחרת ", u"Changed my mind, I want another folder"},
+            {Command26[0], u"כן", u"Yes"},
+            {Command26[1], u"לא", u"No"},
+        });
     for (SpokenCaption& plus : Command12)
-        setWords({{plus, u"+", u"+", u"עותק נוסף", u"One copy more"}});
+        setCaptions(m_state, {{plus, u"+", u"+", u"עותק נוסף", u"One copy more"}});
     for (SpokenCaption& minus : Command13)
-        setWords({{minus, u"−", u"−", u"עותק פחות, או ביטול הבחירה", u"One copy less, or not at all"}});
+        setCaptions(m_state, {{minus, u"−", u"−", u"עותק פחות, או ביטול הבחירה", u"One copy less, or not at all"}});
     Picture2.warning =
         m_state.wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת", u"Few pixels: the print may come out blurred");
     Picture2.spoken = m_state.wording(u"הצגת התמונה בגדול", u"Look at the picture in large");
@@ -103,51 +91,53 @@ void kyoskNew::setBrowserTexts() {
 }
 
 void kyoskNew::setClosingTexts() {
-    setWords({
-        {Frame3, u"יציאה", u"Leaving"},
-        {Label11,
-         u"בחרת תמונות למשלוח והנך מבקש לצאת\n"
-         u"אם ברצונך לצאת לחץ על יציאה\n"
-         u"אם ברצונך לשלוח את התמונות להדפסה\n"
-         u"לחץ על סיים ושלח",
-         u"You have chosen to leave this program,\n"
-         u"but you did select images.\n"
-         u"In case you want leave press EXIT.\n"
-         u"If you want to send the images,\n"
-         u"to be printed\n"
-         u"Please press the button \n"
-         u"''Finish Order And Send''"},
-        {Command15, u"יציאה", u"EXIT"},
-        {Command4, u"סגור חלון זה", u"Close this window"},
-        {Frame4, u"סיום הבחירה", u"Your order"},
-        {closingHead, u"כמעט סיימנו", u"Almost done"},
-        {Label19Prompt, u"גודל נייר", u"Paper size"},
-        {Label20Prompt, u"עותקים", u"Copies"},
-        {Label17, u"כתובת דואר אלקטרוני", u"E-mail address"},
-        {Label33, u"דואר אלקטרוני שדה חובה", u"E-mail is a required field"},
-        {Text2Prompt, u"הערות", u"Notes"},
-        {LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
-         u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box "},
-        {Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon"},
-        {Command8, u"המשך", u"Continue"},
-        {Command10, u"חזור לדף בחירת תמונות ", u"Back to the pictures"},
-        {Pic4snifim, u"בחר סניף שבו תרצה לקבל את התמונות", u"Choose the branch where you want to get the pictures"},
-        {Image33, u"בחר סניף", u"Choose a branch"},
-        {Command28, u"סגור", u"Close"},
-        {Picture7, u"דחיסת תמונות גדולות", u"Compression of large prints"},
-        {Label37, u"האם להעמיק את דחיסת התמונות? המשלוח יהיה מהיר יותר",
-         u"Compress the pictures more deeply? They will be sent faster"},
-        {Command20, u"לא להעמיק דחיסה", u"Do not compress deeper"},
-        {Command21, u"כן להעמיק דחיסה", u"Compress deeper"},
-    });
+    setCaptions(
+        m_state,
+        {
+            {Frame3, u"יציאה", u"Leaving"},
+            {Label11,
+             u"בחרת תמונות למשלוח והנך מבקש לצאת\n"
+             u"אם ברצונך לצאת לחץ על יציאה\n"
+             u"אם ברצונך לשלוח את התמונות להדפסה\n"
+             u"לחץ על סיים ושלח",
+             u"You have chosen to leave this program,\n"
+             u"but you did select images.\n"
+             u"In case you want leave press EXIT.\n"
+             u"If you want to send the images,\n"
+             u"to be printed\n"
+             u"Please press the button \n"
+             u"''Finish Order And Send''"},
+            {Command15, u"יציאה", u"EXIT"},
+            {Command4, u"סגור חלון זה", u"Close this window"},
+            {Frame4, u"סיום הבחירה", u"Your order"},
+            {closingHead, u"כמעט סיימנו", u"Almost done"},
+            {Label19Prompt, u"גודל נייר", u"Paper size"},
+            {Label20Prompt, u"עותקים", u"Copies"},
+            {Label17, u"כתובת דואר אלקטרוני", u"E-mail address"},
+            {Label33, u"דואר אלקטרוני שדה חובה", u"E-mail is a required field"},
+            {Text2Prompt, u"הערות", u"Notes"},
+            {LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
+             u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box "},
+            {Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon"},
+            {Command8, u"המשך", u"Continue"},
+            {Command10, u"חזור לדף בחירת תמונות ", u"Back to the pictures"},
+            {Pic4snifim, u"בחר סניף שבו תרצה לקבל את התמונות", u"Choose the branch where you want to get the pictures"},
+            {Image33, u"בחר סניף", u"Choose a branch"},
+            {Command28, u"סגור", u"Close"},
+            {Picture7, u"דחיסת תמונות גדולות", u"Compression of large prints"},
+            {Label37, u"האם להעמיק את דחיסת התמונות? המשלוח יהיה מהיר יותר",
+             u"Compress the pictures more deeply? They will be sent faster"},
+            {Command20, u"לא להעמיק דחיסה", u"Do not compress deeper"},
+            {Command21, u"כן להעמיק דחיסה", u"Compress deeper"},
+        });
     Combo1.spoken = m_state.wording(u"ספק הדואר, אחרי השטרודל", u"Mail provider, behind the at sign");
     if (m_promptStands)
         Combo1.text = mailDomainPrompt(m_state.english());
     Label4kpn3.text = QString::number(m_state.coupon.MisparKoopon);
     if (m_state.TachanaMekomit)
-        setWords({{Command7, u"המשך", u"Continue"}});
+        setCaptions(m_state, {{Command7, u"המשך", u"Continue"}});
     else
-        setWords({{Command7, u"המשך ללא כתובת דואר", u"Continue without my address"}});
+        setCaptions(m_state, {{Command7, u"המשך ללא כתובת דואר", u"Continue without my address"}});
 }
 
 void kyoskNew::showGuide(Guide guide) {

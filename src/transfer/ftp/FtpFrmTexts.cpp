@@ -1,6 +1,7 @@
 // All wordings of the page that sends by FTP but those of its status line, which stand beside its events.
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
+#include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 #include "transfer/ftp/FtpFrm.h"
 
@@ -162,66 +163,67 @@ void FtpFrm::setTexts() {
 }
 
 void FtpFrm::setButtonTexts() {
-    const auto set = [this](Caption& control, const char16_t* hebrew, const char16_t* english) {
-        control.text = wording(hebrew, english);
-    };
-    set(Command12, u"שלח ", u"Send ");
-    set(Command10, u"שלח שוב", u"Send again");
-    set(Command28, u"הזמנה חדשה", u"New order");
-    set(Command15, u"עצור", u"Stop");
-    set(Command21, u"Stop", u"Stop");
-    set(Command18, u"עצור ספירה", u"Stop the count");
-    set(Command11, u"יציאה", u"Exit");
-    set(Command8, u"יציאה", u"Exit");
-    set(Command14, u"לא לסגור", u"Do not close");
-    set(Command16, u"סגור את התוכנה למרות שלא נשלחו התמונות", u"Close the program although the pictures were not sent");
-    set(Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here");
-    set(Command24, u"הצג יותר פרטים", u"Show more details");
-    set(Command9, u"הסתר פרטים", u"Hide details");
-    set(Image3, u"סגור", u"Close");
-    set(Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder");
-    set(Image5, u"שלח עכשיו", u"Send now");
-    set(Command13, u"לפני שליחה", u"Before sending");
-    set(Command1, u"משלוח חוזר", u"Resend");
-    set(Command2, u"מילוי ושליחה", u"Refill and send");
-    set(Command4, u"שליחה בסבבים", u"Send in rounds");
-    const std::pair<Caption*, const char16_t*> sameInBoth[] = {{&Command3, u"put"},
-                                                               {&Command5, u"get"},
-                                                               {&Command6, u"del"},
-                                                               {&Command7, u"make dir"},
-                                                               {&Command17, u"SendOneOrder"},
-                                                               {&Command19, u"All Orders"},
-                                                               {&Command25, u"BdikaAfterUploadB"},
-                                                               {&Command27, u"Copy"}};
-    for (const auto& [control, text] : sameInBoth)
-        control->text = QString::fromUtf16(text);
+    setCaptions(m_state,
+                {
+                    {Command12, u"שלח ", u"Send "},
+                    {Command10, u"שלח שוב", u"Send again"},
+                    {Command28, u"הזמנה חדשה", u"New order"},
+                    {Command15, u"עצור", u"Stop"},
+                    {Command21, u"Stop", u"Stop"},
+                    {Command18, u"עצור ספירה", u"Stop the count"},
+                    {Command11, u"יציאה", u"Exit"},
+                    {Command8, u"יציאה", u"Exit"},
+                    {Command14, u"לא לסגור", u"Do not close"},
+                    {Command16, u"סגור את התוכנה למרות שלא נשלחו התמונות",
+                     u"Close the program although the pictures were not sent"},
+                    {Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here"},
+                    {Command24, u"הצג יותר פרטים", u"Show more details"},
+                    {Command9, u"הסתר פרטים", u"Hide details"},
+                    {Image3, u"סגור", u"Close"},
+                    {Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder"},
+                    {Image5, u"שלח עכשיו", u"Send now"},
+                    {Command13, u"לפני שליחה", u"Before sending"},
+                    {Command1, u"משלוח חוזר", u"Resend"},
+                    {Command2, u"מילוי ושליחה", u"Refill and send"},
+                    {Command4, u"שליחה בסבבים", u"Send in rounds"},
+                    {Command3, u"put"},
+                    {Command5, u"get"},
+                    {Command6, u"del"},
+                    {Command7, u"make dir"},
+                    {Command17, u"SendOneOrder"},
+                    {Command19, u"All Orders"},
+                    {Command25, u"BdikaAfterUploadB"},
+                    {Command27, u"Copy"},
+                });
     txtProxy.hint = QStringLiteral("TIS Compatible Proxy (No CERN):");
 }
 
 void FtpFrm::setPanelTexts() {
-    const auto set = [this](Caption& control, const char16_t* hebrew, const char16_t* english) {
-        control.text = wording(hebrew, english);
-    };
-    set(Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
-        u"We have noted that you asked to get the printed pictures by delivery to your home");
-    set(Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload ");
-    set(Label4Mitoch, u"קבצים מתוך ", u"files out of ");
-    set(Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending ");
-    set(Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
-        u"It is advised to wait 30 seconds and then press Send again");
-    set(Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
-        u"The order is kept on this computer, and files that have arrived are not sent again.");
-    set(Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending");
-    set(Label4Minutes, u"דקות", u"minutes");
-    set(PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order");
-    set(Label4Summary, u"סיכום ההזמנה", u"Summary of your order");
-    set(Label4ToSend, u"קבצים לשליחה", u"Files to be sent");
-    set(Label4OnServer, u"נמצאים בשרת", u"On the server");
-    set(Label4Failed, u"שליחה שנכשלה", u"Failed");
-    set(Label4Log, u"יומן", u"Log");
-    set(Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
-        u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all pictures "
-        u"will be printed.");
+    setCaptions(
+        m_state,
+        {
+            {Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
+             u"We have noted that you asked to get the printed pictures by delivery to your home"},
+            {Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload "},
+            {Label4Mitoch, u"קבצים מתוך ", u"files out of "},
+            {Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending "},
+            {Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
+             u"It is advised to wait 30 seconds and then press Send again"},
+            {Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
+             u"The order is kept on this computer, and files that have arrived are not sent again."},
+            {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
+            {Label4Minutes, u"דקות", u"minutes"},
+            {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
+            {Label4Summary, u"סיכום ההזמנה", u"Summary of your order"},
+            {Label4ToSend, u"קבצים לשליחה", u"Files to be sent"},
+            {Label4OnServer, u"נמצאים בשרת", u"On the server"},
+            {Label4Failed, u"שליחה שנכשלה", u"Failed"},
+            {Label4Log, u"יומן", u"Log"},
+            {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
+             u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
+             u"pictures "
+             u"will be printed."},
+        });
 }
 
 void FtpFrm::showCounts() {

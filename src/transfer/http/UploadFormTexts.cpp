@@ -1,4 +1,5 @@
 // All wordings of the page that sends by HTTP, and what it shows of each phase.
+#include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
 
@@ -130,24 +131,23 @@ void UploadForm::showAnswers() {
 }
 
 void UploadForm::setTexts() {
-    const auto set = [this](Caption& control, const char16_t* hebrew, const char16_t* english) {
-        control.text = wording(hebrew, english);
-    };
-    set(Command2, u"רענן רשימה", u"Refresh list");
-    set(Command3, u"עצור את המשלוח", u"Stop the sending");
-    set(Command10, u"המשך את המשלוח", u"Continue the sending");
-    set(Command28, u"הזמנה חדשה", u"New order");
-    set(Image3, u"סגור", u"Close");
-    set(endClose, u"סגור", u"Close");
-    set(Image5, u"שלח שוב", u"Send again");
-    set(Label9, u"שולח", u"Sending");
-    set(Label11, u"הזמנה זו עלתה במלואה", u"This order went up in full");
-    set(Label13, u" המשלוח יחל בעוד ", u"The sending starts in");
-    set(Label14, u"שניות", u"seconds");
-    set(Label4Notru, u"מספר הקבצים שנותרו למשלוח ", u"Files left to send ");
-    set(Label4Rshom, u"נא לרשום את מספר ההזמנה ", u"Please write down the order number");
-    set(Label4Alu, u" הקבצים עלו בהצלחה ", u"The files went up successfully");
-    set(Label4Tashlum, u"נא להתקשר לחנות לגבי תשלום", u"Please call the shop about payment");
+    setCaptions(m_state, {
+                             {Command2, u"רענן רשימה", u"Refresh list"},
+                             {Command3, u"עצור את המשלוח", u"Stop the sending"},
+                             {Command10, u"המשך את המשלוח", u"Continue the sending"},
+                             {Command28, u"הזמנה חדשה", u"New order"},
+                             {Image3, u"סגור", u"Close"},
+                             {endClose, u"סגור", u"Close"},
+                             {Image5, u"שלח שוב", u"Send again"},
+                             {Label9, u"שולח", u"Sending"},
+                             {Label11, u"הזמנה זו עלתה במלואה", u"This order went up in full"},
+                             {Label13, u" המשלוח יחל בעוד ", u"The sending starts in"},
+                             {Label14, u"שניות", u"seconds"},
+                             {Label4Notru, u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "},
+                             {Label4Rshom, u"נא לרשום את מספר ההזמנה ", u"Please write down the order number"},
+                             {Label4Alu, u" הקבצים עלו בהצלחה ", u"The files went up successfully"},
+                             {Label4Tashlum, u"נא להתקשר לחנות לגבי תשלום", u"Please call the shop about payment"},
+                         });
     Label4Left.text = Label4Notru.text.trimmed() + QStringLiteral(": ") + Label12.text;
     tellPhase();
     Q_EMIT changed();

@@ -3,15 +3,12 @@
 #include "finished/orders/MoogMeret.h"
 #include "views/window/PageView.h"
 
-class QFrame;
-class QListWidget;
-
 namespace lumora {
 
 class Gauge;
 class ScrolledPicture;
 
-class MoogMeretView : public PageView {
+class MoogMeretView : public ViewOf<MoogMeret> {
     Q_OBJECT
 public:
     MoogMeretView(MoogMeret& page, const SessionState& state, const Theme& theme);
@@ -24,14 +21,14 @@ private:
     QWidget* makeOrders();
     QWidget* makeHint();
     QWidget* makeFiles();
-    QWidget* makeWays();
     QWidget* makeWalk();
+    QWidget* makeWays();
     void makeBars();
+    void renderOrders();
     void renderFiles();
     void renderWalk();
+    void renderAnswer();
 
-    MoogMeret& m_page;
-    const MoogMeretControls& c;
     QListWidget* m_orders = nullptr;
     QWidget* m_hint = nullptr;
     QListWidget* m_fileList = nullptr;

@@ -252,7 +252,6 @@ QWidget* RedIView::makeOperator() {
 void RedIView::makeMenu() {
     RedI& page = m_page;
     m_menu = new Overlay(theme(), this);
-    m_menu->setCardWidth(660);
     m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, m_shows.CommandMenu, "title"));
     auto* grid = new QGridLayout;
     grid->setSpacing(theme().px(10));
@@ -290,7 +289,6 @@ void RedIView::makeMenu() {
 void RedIView::makeHelp() {
     RedI& page = m_page;
     m_help = new Overlay(theme(), this);
-    m_help->setCardWidth(640);
     m_help->column()->addWidget(label(u"FrameHelp"_s, m_shows.FrameHelp, "title"));
     m_help->column()->addWidget(label(u"Label38"_s, m_shows.Label38));
     m_helpText = makeLabel(m_help, "muted");

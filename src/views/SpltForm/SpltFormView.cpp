@@ -11,12 +11,9 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 SpltFormView::SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme)
-    : ViewOf(page, state, theme)
-    , c(page.controls()) {
+    : ViewOf(page, state, theme) {
     // No part of an order's way; its room keeps the name at its place.
-    QSizePolicy room = frame().steps().sizePolicy();
-    room.setRetainSizeWhenHidden(true);
-    frame().steps().setSizePolicy(room);
+    keepPlaceWhenHidden(frame().steps());
     frame().steps().hide();
     frame().content()->addLayout(inRow(Space::Wide, {{makeCut(), 2}, {makeJoin(), 3}}), 1);
     frame().content()->addWidget(makeResult());
@@ -28,31 +25,24 @@ QWidget* SpltFormView::firstFocus() const {
     return m_cutFolder;
 }
 
-QVBoxLayout* SpltFormView::makeList(const TextList& list, const Caption& caption, void (SpltForm::*clicked)(int)) {
+QVBoxLayout* SpltFormView::makeList(const TextList& rows, const Caption& caption, void (SpltForm::*clicked)(int)) {
     QLabel* title = label(caption, "smallMuted");
-    auto* widget = new QListWidget(this);
-    widget->setTextElideMode(Qt::ElideMiddle);
-    widget->setProperty("names", true);
-    widget->setLayoutDirection(Qt::LeftToRight); // names of files, whose middle may be left out
-    widget->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    widget->setUniformItemSizes(true);
+    QListWidget* made = clicked ? list(rows, clicked, LeafName) : listing(rows, LeafName);
+    made->setProperty("names", true);
+    made->setLayoutDirection(Qt::LeftToRight); // names of files, whose middle may be left out
+    made->setUniformItemSizes(true);
     if (clicked) {
-        // By a click, or by the keyboard's arrows.
-        connect(widget, &QListWidget::itemClicked, this,
-                [&page = m_page, widget, clicked](QListWidgetItem* item) { (page.*clicked)(widget->row(item)); });
-        connect(widget, &QListWidget::currentRowChanged, this, [&page = m_page, clicked](int at) {
+        connect(made, &QListWidget::currentRowChanged, this, [choose = toPage(clicked)](int at) {
             if (at >= 0)
-                (page.*clicked)(at);
+                choose(at); // by the keyboard's arrows
         });
     } else {
-        widget->setProperty("dense", true);
-        widget->setSelectionMode(QAbstractItemView::NoSelection);
-        widget->setFocusPolicy(Qt::NoFocus);
+        made->setProperty("dense", true);
+        made->setSelectionMode(QAbstractItemView::NoSelection);
     }
-    bindList(widget, list, LeafName);
-    title->setBuddy(widget);
-    m_titles.emplace_back(&caption, widget);
-    return inColumn(Space::Small, {title, {widget, 1}});
+    title->setBuddy(made);
+    m_titles.emplace_back(&caption, made);
+    return inColumn(Space::Small, {title, {made, 1}});
 }
 
 // The chief work of a column. The bottom bar's main action would be one too many here.
@@ -91,9 +81,7 @@ QWidget* SpltFormView::makeJoin() {
     QLayout* all = makeList(c.ListChalakim, c.Label4Chalakim, &SpltForm::ListChalakim_Click);
     QLabel* length = lineLabel(c.Label4Length, "smallMuted");
     length->setAlignment(Qt::AlignTrailing | Qt::AlignVCenter);
-    QSizePolicy room = length->sizePolicy();
-    room.setRetainSizeWhenHidden(true); // the lists keep their height
-    length->setSizePolicy(room);
+    keepPlaceWhenHidden(*length);
     const Card card = makeCard("card", Pad::Normal);
     add(*card.column,
         {inRow(Space::Small, {{label(c.Label4Join, "large"), 1}, lineLabel(c.Label4Counts, "smallMuted")}),
@@ -107,7 +95,9 @@ QWidget* SpltFormView::makeJoin() {
 
 QWidget* SpltFormView::makeResult() {
     m_resultSign = new QLabel(this);
-    m_resultWhere = words("smallMuted");
+    QLabel* where = label(c.Label4Where, "smallMuted", [this](const QString& path) {
+        return path.isEmpty() ? path : atLineStart(fromLeft(path), state().english());
+    });
     m_progress = new QProgressBar(this);
     m_progress->setRange(0, 100);
     m_progress->setTextVisible(false);
@@ -117,9 +107,8 @@ QWidget* SpltFormView::makeResult() {
     card.column->addLayout(
         inRow(Space::Normal, {m_resultSign,
                               {inColumn(Space::None, {label(c.Label4Idle, "strong"), label(c.Label4Work, "strong"),
-                                                      label(c.Label4Total, "strong"), m_resultWhere, m_progress}),
+                                                      label(c.Label4Total, "strong"), where, m_progress}),
                                1}}));
-    bind(u"Label4Where"_s, m_resultWhere, [this] { return c.Label4Where.text; });
     return m_result;
 }
 
@@ -149,8 +138,8 @@ void SpltFormView::renderFamilies() {
         QListWidgetItem* row = m_families->item(i);
         row->setText(fromLeft(family.name) + u'\n' + isolated(family.words));
         row->setToolTip(c.List4Bodedim.item(i));
-        row->setIcon(QIcon(theme().icon(family.good ? u"check-circle"_s : u"warning"_s, theme().px(24),
-                                        family.good ? Theme::Colour::Good : Theme::Colour::Danger)));
+        setIcon(row, family.good ? u"check-circle"_s : u"warning"_s,
+                family.good ? Theme::Colour::Good : Theme::Colour::Danger);
     }
 }
 
@@ -166,9 +155,7 @@ void SpltFormView::renderResult() {
                  {"alarm", u"warning"_s, Theme::Colour::Danger}};
     const auto& look = looks[static_cast<int>(m_page.phase())];
     changeRole(m_result, look.role);
-    m_resultSign->setPixmap(theme().icon(look.icon, theme().px(30), look.colour));
-    m_resultWhere->setText(atLineStart(fromLeft(c.Label4Where.text), state().english()));
-    m_resultWhere->setVisible(!c.Label4Where.text.isEmpty());
+    m_resultSign->setPixmap(theme().icon(look.icon, theme().size(IconSize::Line), look.colour));
     m_progress->setVisible(m_page.phase() == SpltForm::Phase::Working);
     m_progress->setValue(m_page.percent());
 }

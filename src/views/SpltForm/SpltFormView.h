@@ -3,8 +3,6 @@
 #include "finished/pieces/SpltForm.h"
 #include "views/window/PageView.h"
 
-class QFrame;
-class QListWidget;
 class QProgressBar;
 
 namespace lumora {
@@ -24,18 +22,16 @@ private:
     QWidget* makeResult();
     void makeBars();
     // A list with its title over it. clicked null: only to look at.
-    QVBoxLayout* makeList(const TextList& list, const Caption& caption, void (SpltForm::*clicked)(int) = nullptr);
+    QVBoxLayout* makeList(const TextList& rows, const Caption& caption, void (SpltForm::*clicked)(int) = nullptr);
     QPushButton* workButton(const Caption& caption, void (SpltForm::*clicked)());
     void renderFamilies();
     void renderResult();
 
-    const SpltFormControls& c;
     QPushButton* m_cutFolder = nullptr;
     QListWidget* m_families = nullptr;
     QStringList m_familyWords; // as they stand in the rows
     QFrame* m_result = nullptr;
     QLabel* m_resultSign = nullptr;
-    QLabel* m_resultWhere = nullptr;
     QProgressBar* m_progress = nullptr;
     std::vector<std::pair<const Caption*, QListWidget*>> m_titles;
 };

@@ -1,7 +1,5 @@
 #include "views/hatchala/hatchalaView.h"
 
-#include "imaging/files/PictureFile.h"
-#include "platform/files/Files.h"
 #include "views/hatchala/StartDecoration.h"
 #include "views/kit/Overlay.h"
 
@@ -14,19 +12,8 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-void keepPlaceWhenHidden(QWidget& widget) {
-    QSizePolicy policy = widget.sizePolicy();
-    policy.setRetainSizeWhenHidden(true);
-    widget.setSizePolicy(policy);
-}
-
-} // namespace
-
 hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files)
     : ViewOf(page, state, theme)
-    , c(page.controls())
     , m_files(files) {
     frame().steps().setStep(OrderStep::Start);
     frame().setTitleVisible(false);
@@ -158,19 +145,15 @@ void hatchalaView::makeStart() {
 
 // The question at which shop the prints are fetched.
 void hatchalaView::makeShops() {
-    m_shops = new Overlay(theme(), this);
-    auto* list = new QListWidget(m_shops);
-    list->setFixedHeight(theme().px(130));
-    const auto taken = [this, list](QListWidgetItem* item) { m_page.List1_Click(list->row(item)); };
-    connect(list, &QListWidget::itemClicked, this, taken);
-    connect(list, &QListWidget::itemActivated, this, taken);
-    bindList(list, c.List1);
-    add(*m_shops->column(), {label(c.List1Caption, "title"),
-                             list,
-                             {button(c.shopsBack, Role::Secondary, &hatchala::Picture1_Escape), 0, Qt::AlignLeading}});
-    m_shops->setFirstFocus(list);
+    QListWidget* shops = list(c.List1, &hatchala::List1_Click);
+    shops->setFixedHeight(theme().px(130));
+    m_shops = new Overlay(theme(), this,
+                          {label(c.List1Caption, "title"),
+                           shops,
+                           {button(c.shopsBack, Role::Secondary, &hatchala::Picture1_Escape), 0, Qt::AlignLeading}});
+    m_shops->setFirstFocus(shops);
     m_shops->whenEscaped(toPage(&hatchala::Picture1_Escape));
-    m_shopList = list;
+    m_shopList = shops;
     bind(u"Picture1"_s, m_shops->card(), [this] { return c.Picture1.text; });
 }
 
@@ -231,15 +214,8 @@ void hatchalaView::renderMotion() {
 }
 
 void hatchalaView::renderAdvert() {
-    if (m_advertFile != c.Picture4) {
-        m_advertFile = c.Picture4;
-        QImage picture;
-        if (const auto path = m_files.drives().toHost(m_advertFile)) {
-            if (const auto loaded = loadPicture(*path))
-                picture = loaded->image();
-        }
-        m_advert->setPicture(picture);
-    }
+    if (std::exchange(m_advertFile, c.Picture4) != c.Picture4)
+        m_advert->setPicture(loadedPicture(m_files, m_advertFile));
     m_advert->setVisible(m_advert->hasPicture());
 }
 

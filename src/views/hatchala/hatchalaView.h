@@ -36,7 +36,6 @@ private:
     void renderAdvert();
     void renderHelp();
 
-    const hatchalaControls& c;
     const Files& m_files;
     QPushButton* m_start = nullptr;
     QLabel* m_headline = nullptr;

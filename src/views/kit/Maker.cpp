@@ -12,6 +12,17 @@ QLabel* makeLabel(QWidget* parent, const char* type) {
     return label;
 }
 
+QLabel* centred(QLabel* label) {
+    label->setAlignment(Qt::AlignCenter);
+    return label;
+}
+
+void keepPlaceWhenHidden(QWidget& widget) {
+    QSizePolicy policy = widget.sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    widget.setSizePolicy(policy);
+}
+
 void setRole(QWidget* widget, const char* role) {
     widget->setProperty("role", QString::fromLatin1(role));
 }
@@ -86,6 +97,13 @@ Card Maker::makeCard(const char* role, Pad pad, Space gap) const {
     column->setContentsMargins(m_theme.margins(pad));
     frame->setLayout(column);
     return {frame, column};
+}
+
+Card Maker::makeSignedCard(const char* role, const QString& icon, QColor colour) const {
+    const Card card = makeCard(role, Pad::Normal);
+    QVBoxLayout* column = inColumn(Space::Tight);
+    card.column->addLayout(inRow(Space::Wide, {{sign(icon, IconSize::Line, colour), 0, Qt::AlignTop}, {column, 1}}));
+    return {card.frame, column};
 }
 
 QLabel* Maker::words(const char* type, const QString& text) const {

@@ -57,6 +57,8 @@ public:
     QWidget* inMiddle(QWidget* inside, int share) const;
     // role: card, well, notice, alarm or success.
     Card makeCard(const char* role, Pad pad, Space gap = Space::Small) const;
+    // The same with a sign beside its column, and rarely more than two lines in it.
+    Card makeSignedCard(const char* role, const QString& icon, QColor colour) const;
     void add(QBoxLayout& to, std::initializer_list<Item> items) const;
 
     QLabel* words(const char* type, const QString& text = {}) const;
@@ -70,6 +72,10 @@ private:
     QWidget* m_parent;
 };
 
+// The label with its words in the middle.
+QLabel* centred(QLabel* label);
+// What lies beside the widget stays where it is when the widget hides.
+void keepPlaceWhenHidden(QWidget& widget);
 // Labels take their look from the theme by this.
 QLabel* makeLabel(QWidget* parent, const char* type);
 void setRole(QWidget* widget, const char* role);

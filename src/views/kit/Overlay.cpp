@@ -11,7 +11,7 @@
 
 namespace lumora {
 
-Overlay::Overlay(const Theme& theme, QWidget* parent)
+Overlay::Overlay(const Theme& theme, QWidget* parent, std::initializer_list<Item> items)
     : QWidget(parent)
     , Maker(theme, this)
     , m_theme(theme) {
@@ -19,6 +19,7 @@ Overlay::Overlay(const Theme& theme, QWidget* parent)
     const Card card = makeCard("card", Pad::Wide, Space::Wide);
     m_card = card.frame;
     m_column = card.column;
+    add(*m_column, items);
     setFocusPolicy(Qt::StrongFocus);
     parent->installEventFilter(this);
 }
@@ -41,7 +42,7 @@ void Overlay::whenEscaped(std::function<void()> handler) {
     connect(this, &Overlay::escaped, this, [handler = std::move(handler)] { handler(); });
 }
 
-void Overlay::setCardWidth(double width) {
+void Overlay::setWidth(Width width) {
     m_width = width;
     place();
 }
@@ -93,7 +94,8 @@ void Overlay::place() {
     const QSize available = size() - QSize(2 * room, 2 * room);
     QSize wanted = available;
     if (!m_filling) {
-        const int width = std::min(m_theme.px(m_width), available.width());
+        static constexpr int widths[] = {640, 780, 920}; // of a 1024 by 768 window
+        const int width = std::min(m_theme.px(widths[static_cast<int>(m_width)]), available.width());
         int height = m_card->layout()->hasHeightForWidth() ? m_card->layout()->totalHeightForWidth(width)
                                                            : m_card->sizeHint().height();
         height = std::max(height, m_card->minimumSizeHint().height());

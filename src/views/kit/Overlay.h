@@ -13,7 +13,7 @@ class Overlay : public QWidget, protected Maker {
     Q_OBJECT
 public:
     // Covers parent and follows its size. Closed at first.
-    Overlay(const Theme& theme, QWidget* parent);
+    Overlay(const Theme& theme, QWidget* parent, std::initializer_list<Item> items = {});
 
     void setOpen(bool open);
     bool isOpen() const { return m_open; }
@@ -27,8 +27,9 @@ public:
     void addButtons(QWidget* back, QWidget* main, First first = First::Main);
     void addButton(QWidget* only, Qt::Alignment side = Qt::AlignTrailing);
     void whenEscaped(std::function<void()> handler);
-    // Of a 1024 by 768 window.
-    void setCardWidth(double width);
+    // Of the card, if the window has that much.
+    enum class Width { Normal, Wide, Full };
+    void setWidth(Width width);
     // The card takes all the room that the margins leave.
     void setFilling();
     // What has the keyboard when the panel opens.
@@ -57,7 +58,7 @@ private:
     QVBoxLayout* m_column;
     QPointer<QWidget> m_firstFocus;
     QPointer<QWidget> m_before;
-    double m_width = 620;
+    Width m_width = Width::Normal;
     double m_reveal = 1;
     bool m_filling = false;
     bool m_open = false;

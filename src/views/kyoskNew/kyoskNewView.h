@@ -3,8 +3,6 @@
 #include "selection/pictures/kyoskNew.h"
 #include "views/window/PageView.h"
 
-class QFrame;
-class QGridLayout;
 class QStackedLayout;
 
 namespace lumora {
@@ -28,23 +26,20 @@ protected:
 private:
     QLayout* makeTopRow();
     QWidget* makeGrid();
+    PictureCell* makeCell(int i);
     QWidget* makeEmpty();
     QWidget* makeSide();
     void makeBars();
-    // A row of two buttons; first has the keyboard when the panel opens.
-    void addAnswers(Overlay& panel, QPushButton* other, QPushButton* first);
-    void makeLeavePanel();
+    void makeQuestions();
     void makeClosingPanel();
     void makeBranchPanel();
-    void makeCompressionPanel();
-    void makeHelpPanel();
+    void pointAtBranch(const QObject* widget);
     void renderFolder();
     void renderCells();
     void renderClosing();
     void fitCells();
     void takeFocus();
 
-    const kyoskNewControls& m_shown;
     QStackedLayout* m_body = nullptr;
     std::array<PictureCell*, cellsOfPage> m_cells{};
     LargePicture* m_large = nullptr;

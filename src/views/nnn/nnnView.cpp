@@ -17,8 +17,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
-    : ViewOf(page, state, theme)
-    , m_shown(page.controls()) {
+    : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Details);
     auto* content = new QWidget(this);
     m_steps = new QStackedLayout(content);
@@ -49,7 +48,7 @@ QWidget* nnnView::makeMenu() {
             continue; // leaving and the language stand in the header
         auto* tile = new Tile(theme(), this, QString::fromLatin1(icons[static_cast<std::size_t>(i)]));
         connect(tile, &QAbstractButton::clicked, this, [this, i] { m_page.Image1_Click(i); });
-        bind(tile, m_shown.Image1[static_cast<std::size_t>(i)]);
+        bind(tile, c.Image1[static_cast<std::size_t>(i)]);
         m_tiles[static_cast<std::size_t>(i)] = tile;
     }
     return menu;
@@ -58,7 +57,7 @@ QWidget* nnnView::makeMenu() {
 void nnnView::placeTiles() {
     QList<int> wanted;
     for (int i = 0; i < 10; ++i) {
-        if (m_tiles[static_cast<std::size_t>(i)] && m_shown.Image1[static_cast<std::size_t>(i)].visible)
+        if (m_tiles[static_cast<std::size_t>(i)] && c.Image1[static_cast<std::size_t>(i)].visible)
             wanted += i;
     }
     if (wanted == m_placed)
@@ -84,32 +83,32 @@ QWidget* nnnView::makeDetails() {
         add(*form.column, {title, box, Space::Small});
         return box;
     };
-    m_name = line(m_shown.Text2, m_shown.LabelText2, &nnn::Text2_Change);
-    m_telephone = line(m_shown.Text3, m_shown.LabelText3, &nnn::Text3_Change);
+    m_name = line(c.Text2, c.LabelText2, &nnn::Text2_Change);
+    m_telephone = line(c.Text3, c.LabelText3, &nnn::Text3_Change);
     m_telephone->setInputMethodHints(Qt::ImhDialableCharactersOnly);
-    m_address = line(m_shown.Text4, m_shown.LabelText4, &nnn::Text4_Change);
+    m_address = line(c.Text4, c.LabelText4, &nnn::Text4_Change);
     form.column->addLayout(
-        inRow(Space::Normal, {checkBox(m_shown.Check2, toPage(&nnn::Check2_Click)), Item::room(),
-                              button(m_shown.Command10, Role::Plain, &nnn::Command10_Click, u"memory"_s)}));
+        inRow(Space::Normal, {checkBox(c.Check2, toPage(&nnn::Check2_Click)), Item::room(),
+                              button(c.Command10, Role::Plain, &nnn::Command10_Click, u"memory"_s)}));
     return inMiddle(inBox(inColumn(Space::None, {form.frame, Item::room()})), 4);
 }
 
 QWidget* nnnView::makeOptions() {
     auto* sizes = inRow(Space::Wide);
-    for (std::size_t i = 0; i < m_shown.Option1.size(); ++i) {
+    for (std::size_t i = 0; i < c.Option1.size(); ++i) {
         const auto paper = [](QPainter& painter, const QRectF& place, const QString& size) {
             drawPaperSample(painter, place, size);
         };
         auto* card = new DrawingCard(theme(), this, paper, {190, 200}, DrawingCard::Words::Size);
-        bindChoice(card, m_shown.Option1[i], [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
+        bindChoice(card, c.Option1[i], [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
         sizes->addWidget(card, 2);
     }
-    m_moreSizes = comboBox(m_shown.Combo1.rows, m_shown.Combo1, toPage(&nnn::Combo1_Click));
+    m_moreSizes = comboBox(c.Combo1.rows, c.Combo1, toPage(&nnn::Combo1_Click));
     m_moreSizes->setMinimumWidth(theme().px(220));
-    sizes->addLayout(
-        inColumn(Space::Normal, {Item::room(), m_moreSizes, label(m_shown.Label4kpn, "muted"), Item::room()}), 2);
+    sizes->addLayout(inColumn(Space::Normal, {Item::room(), m_moreSizes, label(c.Label4kpn, "muted"), Item::room()}),
+                     2);
     auto* kinds = inRow(Space::Wide);
-    for (std::size_t i = 0; i < m_shown.Option3.size(); ++i) {
+    for (std::size_t i = 0; i < c.Option3.size(); ++i) {
         auto* card = new DrawingCard(theme(), this,
                                      [finish = i == 0 ? PaperFinish::Matte : PaperFinish::Glossy](
                                          QPainter& painter, const QRectF& place, const QString&) {
@@ -118,16 +117,14 @@ QWidget* nnnView::makeOptions() {
                                          drawThinLine(painter, paper);
                                      },
                                      {260, 165});
-        bindChoice(card, m_shown.Option3[i], [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
+        bindChoice(card, c.Option3[i], [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
         kinds->addWidget(card, 2);
     }
     kinds->addStretch(2);
-    QWidget* step = inBox(inColumn(Space::Small, {label(m_shown.LabelSizes, "large"),
-                                                  {sizes, 3},
-                                                  Space::Tight,
-                                                  label(m_shown.LabelKinds, "large"),
-                                                  {kinds, 2}}));
-    bind(new QWidget(step), m_shown.Frame4);
+    QWidget* step = inBox(
+        inColumn(Space::Small,
+                 {label(c.LabelSizes, "large"), {sizes, 3}, Space::Tight, label(c.LabelKinds, "large"), {kinds, 2}}));
+    bind(new QWidget(step), c.Frame4);
     return step;
 }
 
@@ -141,18 +138,16 @@ QWidget* nnnView::makeBorders() {
                 drawBorderSample(painter, place, code);
             },
             {150, 140}, DrawingCard::Words::Small);
-        bindChoice(card, m_shown.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
+        bindChoice(card, c.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
         grid->addWidget(card, i / 4, i % 4);
     }
     const Card preview = makeCard("card", Pad::Normal);
     m_sample = new BorderSample(preview.frame);
     m_sample->setMinimumSize(theme().px(240), theme().px(200));
-    bind(u"Picture16"_s, m_sample, [this] { return QString::number(m_shown.Picture16); });
-    QLabel* name = label(m_shown.LabelPicture16, "strong");
-    name->setAlignment(Qt::AlignCenter);
-    add(*preview.column, {{m_sample, 1}, name});
+    bind(u"Picture16"_s, m_sample, [this] { return QString::number(c.Picture16); });
+    add(*preview.column, {{m_sample, 1}, centred(label(c.LabelPicture16, "strong"))});
     QWidget* step = inBox(inRow(Space::Far, {{grid, 3}, {preview.frame, 1}}));
-    bind(new QWidget(step), m_shown.Picture4);
+    bind(new QWidget(step), c.Picture4);
     return step;
 }
 
@@ -171,51 +166,47 @@ QWidget* nnnView::makeFit() {
         return made;
     };
     QWidget* step = inBox(inRow(Space::Far, {Item::room(),
-                                             {card(m_shown.Option4, {4, 3}, &nnn::Option4_Click), 2, Qt::AlignVCenter},
-                                             {card(m_shown.Option5, {3, 2}, &nnn::Option5_Click), 2, Qt::AlignVCenter},
+                                             {card(c.Option4, {4, 3}, &nnn::Option4_Click), 2, Qt::AlignVCenter},
+                                             {card(c.Option5, {3, 2}, &nnn::Option5_Click), 2, Qt::AlignVCenter},
                                              Item::room()}));
-    bind(new QWidget(step), m_shown.Picture5);
+    bind(new QWidget(step), c.Picture5);
     return step;
 }
 
 QWidget* nnnView::makeTerms() {
     const Card summary = makeCard("card", Pad::Wide);
     m_chosen = words("large");
-    add(*summary.column, {label(m_shown.LabelChoice, "muted"), m_chosen});
+    add(*summary.column, {label(c.LabelChoice, "muted"), m_chosen});
     const Card terms = makeCard("card", Pad::Wide);
     terms.frame->setMinimumWidth(theme().px(640));
-    QLayout* row = inRow(Space::Normal, {checkBox(m_shown.Check1, toPage(&nnn::Check1_Click)), Item::room(),
-                                         button(m_shown.Command29, Role::Plain, &nnn::Command29_Click, u"document"_s)});
+    QLayout* row = inRow(Space::Normal, {checkBox(c.Check1, toPage(&nnn::Check1_Click)), Item::room(),
+                                         button(c.Command29, Role::Plain, &nnn::Command29_Click, u"document"_s)});
     const Card hint = makeCard("notice", Pad::Slim);
     m_hint = hint.frame;
-    hint.column->addLayout(
-        inRow(Space::Normal, {{label(m_shown.LabelTerms), 1},
-                              button(m_shown.Command30, Role::Quiet, &nnn::Command30_Click, u"close"_s)}));
-    add(*terms.column, {label(m_shown.LabelCheck1, "muted"), row, m_hint});
+    hint.column->addLayout(inRow(Space::Normal, {{label(c.LabelTerms), 1},
+                                                 button(c.Command30, Role::Quiet, &nnn::Command30_Click, u"close"_s)}));
+    add(*terms.column, {label(c.LabelCheck1, "muted"), row, m_hint});
     return inMiddle(inBox(inColumn(Space::Wide, {summary.frame, terms.frame, Item::room()})), 4);
 }
 
 void nnnView::makeBars() {
-    frame().addHeaderActions(
-        {button(m_shown.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
-         button(m_shown.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
-    m_back = button(m_shown.Command4, Role::Secondary, &nnn::Command4_Click);
-    frame().addSecondaryActions({m_back, button(m_shown.Command2, Role::Quiet, &nnn::Command2_Click),
-                                 button(m_shown.Command15, Role::Secondary, &nnn::Command15_Click, u"info"_s),
-                                 button(m_shown.Command14, Role::Secondary, &nnn::Command14_Click, u"eraser"_s)});
-    frame().addStatus({lineLabel(m_shown.Choice, "strong"), sign(u"phone"_s, IconSize::Small),
-                       lineLabel(m_shown.Label4Tel, "muted")});
-    frame().addMainActions({button(m_shown.Command12, Role::Main, &nnn::Command12_Click),
-                            button(m_shown.Command8, Role::Main, &nnn::Command8_Click),
-                            button(m_shown.Command6, Role::Main, &nnn::Command6_Click),
-                            button(m_shown.Command3, Role::Main, &nnn::Command3_Click)});
+    frame().addHeaderActions({button(c.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
+                              button(c.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
+    m_back = button(c.Command4, Role::Secondary, &nnn::Command4_Click);
+    frame().addSecondaryActions({m_back, button(c.Command2, Role::Quiet, &nnn::Command2_Click),
+                                 button(c.Command15, Role::Secondary, &nnn::Command15_Click, u"info"_s),
+                                 button(c.Command14, Role::Secondary, &nnn::Command14_Click, u"eraser"_s)});
+    frame().addStatus(
+        {lineLabel(c.Choice, "strong"), sign(u"phone"_s, IconSize::Small), lineLabel(c.Label4Tel, "muted")});
+    frame().addMainActions(
+        {button(c.Command12, Role::Main, &nnn::Command12_Click), button(c.Command8, Role::Main, &nnn::Command8_Click),
+         button(c.Command6, Role::Main, &nnn::Command6_Click), button(c.Command3, Role::Main, &nnn::Command3_Click)});
     for (QPushButton* main : m_album->mainButtons())
         frame().addMainAction(main);
 
-    m_clean = new Overlay(theme(), this);
-    m_clean->column()->addWidget(label(m_shown.Frame1, "large"));
-    m_clean->addButtons(button(m_shown.Command9, Role::Secondary, &nnn::Command9_Click),
-                        button(m_shown.Command7, Role::Main, &nnn::Command7_Click), Overlay::First::Back);
+    m_clean = new Overlay(theme(), this, {label(c.Frame1, "large")});
+    m_clean->addButtons(button(c.Command9, Role::Secondary, &nnn::Command9_Click),
+                        button(c.Command7, Role::Main, &nnn::Command7_Click), Overlay::First::Back);
     m_clean->whenEscaped(toPage(&nnn::Command9_Click));
 }
 
@@ -245,33 +236,33 @@ void nnnView::escape() {
 }
 
 void nnnView::render() {
-    frame().setTitle(m_shown.Title.text, m_shown.StepLine.visible ? m_shown.StepLine.text : QString());
+    frame().setTitle(c.Title.text, c.StepLine.visible ? c.StepLine.text : QString());
     for (std::size_t i = 0; i < m_tiles.size(); ++i) {
         if (!m_tiles[i])
             continue;
-        m_tiles[i]->setExplanation(m_shown.Image1[i].hint);
+        m_tiles[i]->setExplanation(c.Image1[i].hint);
         m_tiles[i]->setToolTip({});
-        m_tiles[i]->setMarked(m_shown.markedTile == static_cast<int>(i));
+        m_tiles[i]->setMarked(c.markedTile == static_cast<int>(i));
     }
     placeTiles();
-    speak(m_name, m_shown.LabelText2.text);
-    speak(m_telephone, m_shown.LabelText3.text);
-    speak(m_address, m_shown.LabelText4.text);
-    speak(m_moreSizes, m_shown.LabelCombo1.text);
-    if (m_address->property("wanted").toBool() != m_shown.Text4Calls) {
-        m_address->setProperty("wanted", m_shown.Text4Calls);
+    speak(m_name, c.LabelText2.text);
+    speak(m_telephone, c.LabelText3.text);
+    speak(m_address, c.LabelText4.text);
+    speak(m_moreSizes, c.LabelCombo1.text);
+    if (m_address->property("wanted").toBool() != c.Text4Calls) {
+        m_address->setProperty("wanted", c.Text4Calls);
         m_address->setStyleSheet(m_address->styleSheet()); // the look follows the property only when it is set anew
     }
-    m_sample->setCode(borderCode(std::max(m_shown.Picture16, 0)));
-    speak(m_sample, m_shown.LabelPicture16.text);
-    m_hint->setVisible(m_shown.LabelTerms.visible);
-    m_chosen->setText(isolated(m_shown.Choice.text));
+    m_sample->setCode(borderCode(std::max(c.Picture16, 0)));
+    speak(m_sample, c.LabelPicture16.text);
+    m_hint->setVisible(c.LabelTerms.visible);
+    m_chosen->setText(isolated(c.Choice.text));
     setDirectedIcon(m_back, Way::Back);
     const bool moved = m_shownStep != m_page.step();
     m_shownStep = m_page.step();
     m_steps->setCurrentIndex(static_cast<int>(m_page.step()));
     m_album->render();
-    m_clean->setOpen(m_shown.Frame1.visible);
+    m_clean->setOpen(c.Frame1.visible);
     if (m_focusRequest != m_page.focus().request) {
         m_focusRequest = m_page.focus().request;
         if (auto* box = findChild<QWidget*>(m_page.focus().control))

@@ -36,7 +36,6 @@ private:
     void makeBars();
     void placeTiles();
 
-    const nnnControls& m_shown;
     std::unique_ptr<Album> m_album;
     QStackedLayout* m_steps;
     std::array<Tile*, 10> m_tiles{};

@@ -3,21 +3,18 @@
 #include "assembly/edited/B3.h"
 #include "views/preparation/PreparationView.h"
 
-class QListWidget;
-
 namespace lumora {
 
-class B3View : public PreparationView {
+class B3View : public ViewOf<B3, PreparationView> {
     Q_OBJECT
 public:
     B3View(B3& page, const SessionState& state, const Theme& theme);
-    QWidget* firstFocus() const override;
+    QWidget* firstFocus() const override { return m_start; }
 
 protected:
     void render() override;
 
 private:
-    B3& m_page;
     PictureBox* m_picture;
     QFrame* m_pictureCard;
     QListWidget* m_list;

@@ -3,21 +3,18 @@
 #include "assembly/plain/Form2.h"
 #include "views/preparation/PreparationView.h"
 
-class QListWidget;
-
 namespace lumora {
 
-class Form2View : public PreparationView {
+class Form2View : public ViewOf<Form2, PreparationView> {
     Q_OBJECT
 public:
     Form2View(Form2& page, const SessionState& state, const Theme& theme);
-    QWidget* firstFocus() const override;
+    QWidget* firstFocus() const override { return m_start; }
 
 protected:
     void render() override;
 
 private:
-    Form2& m_page;
     QListWidget* m_removed;
     QListWidget* m_list;
     QFrame* m_listCard;

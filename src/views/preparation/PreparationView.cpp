@@ -3,98 +3,59 @@
 #include "views/kit/Cards.h"
 #include "views/kit/Gauge.h"
 
-#include <QHBoxLayout>
-#include <QLabel>
-#include <QVBoxLayout>
-
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
 PreparationView::PreparationView(PreparationPage& page, const SessionState& state, const Theme& theme,
-                                 const NamedCaption& warning, const NamedCaption& warningBelow)
+                                 const Caption& title, const Caption& warning, const Caption& warningBelow)
     : PageView(page, state, theme)
-    , m_page(page) {
+    , m_page(page)
+    , m_title(title)
+    , m_gauge(new Gauge(theme, this))
+    , m_trouble(makeCard("notice", Pad::Normal))
+    , m_sheetCard(makeCard("card", Pad::Slim))
+    , m_sheet(pictureBox())
+    , m_side(inColumn(Space::Normal))
+    , m_total(oneLine("large")) {
+    const PreparationControls& c = page.controls();
     frame().steps().setStep(OrderStep::Preparing);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(theme.px(28));
-    auto* column = new QVBoxLayout;
-    column->setSpacing(theme.px(12));
-    column->addStretch(1);
-    m_gauge = new Gauge(theme, this);
-    column->addWidget(m_gauge, 6, Qt::AlignCenter);
-    auto* progress = label(u"Label4Progress"_s, page.controls().Label4Progress, "title");
-    progress->setAlignment(Qt::AlignCenter);
-    column->addWidget(progress);
-    auto* picture = label(u"Label4Picture"_s, page.controls().Label4Picture, "muted");
-    picture->setAlignment(Qt::AlignCenter);
-    column->addWidget(picture);
-    m_trouble = new QFrame(this);
-    setRole(m_trouble, "notice");
-    m_troubleColumn = new QVBoxLayout(m_trouble);
-    m_troubleColumn->setContentsMargins(theme.px(18), theme.px(12), theme.px(18), theme.px(12));
-    m_troubleColumn->addWidget(label(u"Label4fail"_s, page.controls().Label4fail, "strong"));
-    column->addWidget(m_trouble);
-    column->addStretch(1);
-    auto* keep = new QFrame(this);
-    setRole(keep, "card");
-    auto* keepRow = new QHBoxLayout(keep);
-    keepRow->setContentsMargins(theme.px(20), theme.px(14), theme.px(20), theme.px(14));
-    keepRow->setSpacing(theme.px(16));
-    auto* sign = new QLabel(keep);
-    sign->setPixmap(theme.icon(u"info"_s, theme.px(34), Theme::Colour::Primary));
-    keepRow->addWidget(sign);
-    auto* words = new QVBoxLayout;
-    words->setSpacing(0);
-    words->addWidget(label(warning.name, warning.caption));
-    words->addWidget(label(warningBelow.name, warningBelow.caption, "strong"));
-    keepRow->addLayout(words, 1);
-    column->addWidget(keep);
-    row->addLayout(column, 3);
-    m_side = new QVBoxLayout;
-    m_side->setSpacing(theme.px(12));
-    row->addLayout(m_side, 2);
-    frame().content()->addLayout(row, 1);
-
-    m_total = makeLabel(this, "large");
-    m_total->setWordWrap(false);
+    m_trouble.column->addWidget(label(c.Label4fail, "strong"));
+    const Card keep = makeCard("card", Pad::Normal);
+    keep.column->addLayout(
+        inRow(Space::Wide, {sign(u"info"_s, IconSize::Line),
+                            {inColumn(Space::None, {label(warning), label(warningBelow, "strong")}), 1}}));
+    QLayout* progress = inColumn(Space::Normal, {Item::room(),
+                                                 {m_gauge, 6, Qt::AlignCenter},
+                                                 centred(label(c.Label4Progress, "title")),
+                                                 centred(label(c.Label4Picture, "muted")),
+                                                 m_trouble.frame,
+                                                 Item::room(),
+                                                 keep.frame});
+    frame().content()->addLayout(inRow(Space::Far, {{progress, 3}, {m_side, 2}}), 1);
+    bind(m_sheet, c.Picture5);
+    add(*m_sheetCard.column, {echo(c.Picture5, "smallMuted"), {m_sheet, 1}});
     frame().addStatus(m_total);
-    bind(u"Label5"_s, m_total, [this] { return m_page.controls().Label5.text; });
-    bindHidden(u"Label16"_s, page.controls().Label16);
-    bindHidden(u"Label17"_s, page.controls().Label17);
-    bindList(u"List4fail"_s, page.controls().List4fail);
+    bindName(m_total, c.Label5);
 }
 
-PreparationView::Card PreparationView::addCard(int stretch) {
-    auto* card = new QFrame(this);
-    setRole(card, "card");
-    auto* column = new QVBoxLayout(card);
-    column->setContentsMargins(theme().px(16), theme().px(12), theme().px(16), theme().px(16));
-    m_side->addWidget(card, stretch);
-    return {card, column};
+PictureBox* PreparationView::pictureBox() {
+    auto* made = new PictureBox(theme(), this);
+    made->setMinimumHeight(theme().px(150));
+    return made;
 }
 
-void PreparationView::addSheet(int stretch) {
-    const Card card = addCard(stretch);
-    m_sheetCard = card.frame;
-    card.column->addWidget(label(u"Picture5Title"_s, m_page.controls().Picture5, "smallMuted"));
-    m_sheet = new PictureBox(theme(), m_sheetCard);
-    m_sheet->setMinimumHeight(theme().px(150));
-    bind(u"Picture5"_s, m_sheet, m_page.controls().Picture5);
-    card.column->addWidget(m_sheet, 1);
-}
-
-void PreparationView::renderProgress(const QString& title) {
-    frame().setTitle(title);
-    const PreparationControls& shown = m_page.controls();
+void PreparationView::render() {
+    const PreparationControls& c = m_page.controls();
+    frame().setTitle(m_title.text);
     m_gauge->show(m_page.share(), m_page.positionText(), m_page.countText());
-    m_gauge->setAccessibleName(shown.Label4Progress.text.isEmpty() ? title : shown.Label4Progress.text);
+    m_gauge->setAccessibleName(c.Label4Progress.text.isEmpty() ? m_title.text : c.Label4Progress.text);
     m_total->setVisible(!m_page.totalText().isEmpty());
     m_total->setText(m_page.totalText());
-    m_sheet->setPicture(shown.Picture5Image.image());
-    m_sheetCard->setVisible(m_page.isSheetShown());
-    speak(m_sheet, shown.Picture5.text);
-    m_trouble->setVisible(shown.Label4fail.visible);
+    m_sheet->setPicture(c.Picture5Image.image());
+    m_sheetCard.frame->setVisible(m_page.isSheetShown());
+    speak(m_sheet, c.Picture5.text);
+    m_trouble.frame->setVisible(c.Label4fail.visible);
 }
 
 } // namespace lumora

@@ -3,9 +3,6 @@
 #include "assembly/PreparationPage.h"
 #include "views/window/PageView.h"
 
-class QFrame;
-class QVBoxLayout;
-
 namespace lumora {
 
 class Gauge;
@@ -16,37 +13,27 @@ class PictureBox;
 class PreparationView : public PageView {
     Q_OBJECT
 protected:
-    struct NamedCaption {
-        QString name;
-        const Caption& caption;
-    };
-    PreparationView(PreparationPage& page, const SessionState& state, const Theme& theme, const NamedCaption& warning,
-                    const NamedCaption& warningBelow);
+    // The warning has two lines.
+    PreparationView(PreparationPage& page, const SessionState& state, const Theme& theme, const Caption& title,
+                    const Caption& warning, const Caption& warningBelow);
 
-    // The column beside the progress, for what the pages have of their own.
+    // What all went wrong; shown where the page says so.
+    const Card& trouble() const { return m_trouble; }
+    // The column beside the progress: cards of a page's own around the sheet's.
     QVBoxLayout* side() const { return m_side; }
-    // The card of all that went wrong; shown where the page says so.
-    QFrame* trouble() const { return m_trouble; }
-    QVBoxLayout* troubleColumn() const { return m_troubleColumn; }
-    // A card of the side column, with a line above what it holds.
-    struct Card {
-        QFrame* frame;
-        QVBoxLayout* column;
-    };
-    Card addCard(int stretch);
-    // The sheet's card, to be added where the page has it.
-    void addSheet(int stretch);
+    QFrame* sheet() const { return m_sheetCard.frame; }
+    PictureBox* pictureBox();
 
-    void renderProgress(const QString& title);
+    void render() override;
 
 private:
     PreparationPage& m_page;
+    const Caption& m_title;
     Gauge* m_gauge;
-    QFrame* m_trouble;
-    QVBoxLayout* m_troubleColumn;
+    Card m_trouble;
+    Card m_sheetCard;
+    PictureBox* m_sheet;
     QVBoxLayout* m_side;
-    QFrame* m_sheetCard = nullptr;
-    PictureBox* m_sheet = nullptr;
     QLabel* m_total;
 };
 

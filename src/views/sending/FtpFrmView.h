@@ -7,34 +7,28 @@ class QProgressBar;
 
 namespace lumora {
 
+class Files;
 class PictureBox;
 
-class FtpFrmView : public SendingView {
+class FtpFrmView : public ViewOf<FtpFrm, SendingView> {
     Q_OBJECT
 public:
     FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files);
-    QWidget* firstFocus() const override;
+    QWidget* firstFocus() const override { return m_sendNow; }
 
 protected:
     void render() override;
 
 private:
-    QWidget* makeProgress();
-    QWidget* makeSide();
+    void makeProgress();
+    QLayout* makeSide();
     void makeBars();
-    void makePanels();
-    void showProof();
+    void makeLabArea();
 
-    FtpFrm& m_page;
-    const FtpFrmControls& m_shown;
     const Files& m_files;
     QProgressBar* m_pieces = nullptr;
-    QWidget* m_minutes = nullptr;
-    QFrame* m_summary = nullptr;
-    QLabel* m_summaryLines = nullptr;
     QFrame* m_order = nullptr;
-    QLabel* m_orderName = nullptr;
-    QFrame* m_delivery = nullptr;
+    QLabel* m_summary = nullptr;
     PictureBox* m_proof = nullptr;
     QString m_proofFile;
     QPushButton* m_sendNow = nullptr;

@@ -3,10 +3,6 @@
 #include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
 
-#include <QFrame>
-#include <QPushButton>
-#include <QVBoxLayout>
-
 #include <utility>
 
 namespace lumora {
@@ -15,33 +11,28 @@ using namespace Qt::StringLiterals;
 
 SendingView::SendingView(SendingPage& page, const SessionState& state, const Theme& theme)
     : PageView(page, state, theme)
-    , m_page(page) {
+    , m_page(page)
+    , m_gauge(new Gauge(theme, this)) {
     frame().steps().setStep(OrderStep::Sending);
 }
 
-SendingView::ProgressColumn SendingView::makeProgressColumn() {
-    auto* box = new QWidget(this);
-    auto* column = new QVBoxLayout(box);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(theme().px(10));
-    column->addStretch(1);
-    m_gauge = new Gauge(theme(), box);
-    column->addWidget(m_gauge, 6, Qt::AlignCenter);
-    return {box, column};
+void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side) {
+    QVBoxLayout* progress = inColumn(Space::Small, {Item::room(), {m_gauge, 6, Qt::AlignCenter}});
+    add(*progress, lines);
+    add(*progress, {Item::room()});
+    add(*progress, troubles);
+    frame().content()->addLayout(inRow(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}), 1);
 }
 
-QFrame* SendingView::bindFailure(const SendingCard& card) {
-    m_failure = card.frame;
-    return m_failure;
+QLabel* SendingView::orderName(const Caption& caption, const char* type) {
+    return label(caption, type, [this](QString name) {
+        return name.isEmpty() ? name : atLineStart(fromLeft(name.replace(u'_', u"_\u200B"_s)), state().english());
+    });
 }
 
 QPushButton* SendingView::asMain(SendingButton action, QPushButton* button) {
     m_mainActions[action] = button;
     return button;
-}
-
-QPushButton* SendingView::newOrderButton(const Caption& caption, std::function<void()> clicked) {
-    return asMain(SendingButton::NewOrder, button(caption, Role::Secondary, std::move(clicked)));
 }
 
 void SendingView::bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists) {
@@ -51,14 +42,13 @@ void SendingView::bindLists(const std::vector<std::pair<const char16_t*, const T
     }
 }
 
-void SendingView::renderPhase() {
+void SendingView::render() {
     const SendingControls& shown = m_page.sendingControls();
     const PhaseLook& look = m_page.look();
     window()->setWindowTitle(shown.caption.trimmed().isEmpty() ? u"Lumora"_s : shown.caption.simplified());
     frame().steps().setStep(hasArrived(look.phase) ? OrderStep::Done : OrderStep::Sending);
     frame().setTitle(shown.Label4Title.text);
     renderGauge();
-    m_failure->setVisible(shown.Pic4Failure.visible);
     changeRole(m_mainActions.at(SendingButton::NewOrder), look.main == SendingButton::NewOrder ? "main" : "secondary");
     if (frontOverlay(*window()))
         return;
@@ -71,24 +61,15 @@ void SendingView::renderPhase() {
 }
 
 void SendingView::renderGauge() {
+    static const std::map<SendingSign, Gauge::Mood> moods = {{SendingSign::Good, Gauge::Mood::Good},
+                                                             {SendingSign::Held, Gauge::Mood::Held},
+                                                             {SendingSign::Unclear, Gauge::Mood::Unclear},
+                                                             {SendingSign::Bad, Gauge::Mood::Bad}};
     const SendingGauge gauge = m_page.gauge();
-    switch (gauge.sign) {
-    case SendingSign::Good:
-        m_gauge->showSign(Gauge::Mood::Good);
-        break;
-    case SendingSign::Held:
-        m_gauge->showSign(Gauge::Mood::Held);
-        break;
-    case SendingSign::Unclear:
-        m_gauge->showSign(Gauge::Mood::Unclear);
-        break;
-    case SendingSign::Bad:
-        m_gauge->showSign(Gauge::Mood::Bad);
-        break;
-    default:
+    if (const auto mood = moods.find(gauge.sign); mood != moods.end())
+        m_gauge->showSign(mood->second);
+    else
         m_gauge->show(gauge.share, gauge.large, gauge.small);
-        break;
-    }
     m_gauge->setAccessibleName(gauge.sign == SendingSign::Percent ? gauge.large
                                                                   : m_page.sendingControls().Label4Do.text);
 }

@@ -1,13 +1,9 @@
 #pragma once
 
 #include "transfer/delivery/SendingPage.h"
-#include "views/sending/SendingCards.h"
 #include "views/window/PageView.h"
 
 #include <map>
-
-class QFrame;
-class QPushButton;
 
 namespace lumora {
 
@@ -19,28 +15,23 @@ class SendingView : public PageView {
 protected:
     SendingView(SendingPage& page, const SessionState& state, const Theme& theme);
 
-    // The half of the progress, with the gauge on top; what follows is added to the column.
-    struct ProgressColumn {
-        QWidget* box;
-        QVBoxLayout* column;
-    };
-    ProgressColumn makeProgressColumn();
-    // The card that tells of a failure in the end.
-    QFrame* bindFailure(const SendingCard& card);
+    // The two halves of the page: how the sending stands, and what it is about. The first holds the gauge, the lines
+    // below it and the cards of what went wrong.
+    void layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side);
+    // A label of an order's name, which keeps its own direction and may break behind each underscore.
+    QLabel* orderName(const Caption& caption, const char* type);
     // The button that is the main action in the phases whose row names it.
     QPushButton* asMain(SendingButton action, QPushButton* button);
-    QPushButton* newOrderButton(const Caption& caption, std::function<void()> clicked);
     // The lists of the rules, for scenarios and tests.
     void bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists);
 
-    void renderPhase();
+    void render() override;
 
 private:
     void renderGauge();
 
     SendingPage& m_page;
-    Gauge* m_gauge = nullptr;
-    QFrame* m_failure = nullptr;
+    Gauge* m_gauge;
     std::map<SendingButton, QPushButton*> m_mainActions;
     QWidget* m_main = nullptr; // what had the keyboard last
 };

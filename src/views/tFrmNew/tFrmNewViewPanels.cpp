@@ -208,7 +208,7 @@ void tFrmNewView::addPlain(QHBoxLayout& row, const QString& name, const Caption&
 
 void tFrmNewView::makeHints() {
     m_hints = new Overlay(theme(), this);
-    m_hints->setCardWidth(940);
+    m_hints->setWidth(Overlay::Width::Full);
     m_hints->column()->setContentsMargins(theme().px(24), theme().px(20), theme().px(24), theme().px(18));
     m_hints->column()->setSpacing(theme().px(10));
     auto* grid = new QGridLayout;

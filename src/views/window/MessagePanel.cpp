@@ -9,7 +9,6 @@ MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const
     : Overlay(theme, parent) {
     setObjectName(u"messagePanel"_s);
     setAccessibleName(title.isEmpty() ? text.simplified() : title);
-    setCardWidth(600);
     QLabel* body = words(title.isEmpty() ? "strong" : "body", isolated(text.trimmed()));
     body->setObjectName(u"messageText"_s);
     body->setAlignment(Qt::AlignLeading | Qt::AlignVCenter);

@@ -1,5 +1,7 @@
 #include "views/window/PageView.h"
 
+#include "imaging/files/PictureFile.h"
+#include "platform/files/Files.h"
 #include "views/kit/Cards.h"
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/Keyboard.h"
@@ -132,7 +134,7 @@ void PageView::renderBindings() {
             continue;
         if (control.list) {
             if (auto* list = qobject_cast<QListWidget*>(widget))
-                fillList(*list, *control.list, control.row);
+                fillList(*list, *control.list, control.reading);
             else if (auto* box = qobject_cast<QComboBox*>(widget); box && control.caption)
                 fillCombo(*box, *control.list, *control.caption);
             else if (auto* cards = qobject_cast<ChoiceCards*>(widget))
@@ -162,7 +164,7 @@ void PageView::renderBindings() {
             if (!button->property("spoken").toBool())
                 button->setAccessibleName(caption.text.simplified());
         } else if (auto* label = qobject_cast<QLabel*>(widget)) {
-            const QString text = isolated(caption.text);
+            const QString text = control.reading ? control.reading(caption.text) : isolated(caption.text);
             if (label->text() != text)
                 label->setText(text);
         }
@@ -224,6 +226,38 @@ QLabel* PageView::lineLabel(const Caption& caption, const char* type) {
     return made;
 }
 
+QLabel* PageView::label(const Caption& caption, const char* type, Reading reading) {
+    QLabel* made = label(caption, type);
+    m_controls.back().reading = std::move(reading);
+    return made;
+}
+
+QLabel* PageView::echo(const Caption& caption, const char* type) {
+    QLabel* made = makeLabel(this, type);
+    follow(made, caption);
+    return made;
+}
+
+QListWidget* PageView::listing(const TextList& rows, Reading reading) {
+    auto* made = new QListWidget(this);
+    made->setTextElideMode(Qt::ElideMiddle); // the end of a file's name tells most
+    made->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    made->setFocusPolicy(Qt::NoFocus);
+    const int icon = m_theme.size(IconSize::Button);
+    made->setIconSize({icon, icon});
+    bindList(made, rows, std::move(reading));
+    return made;
+}
+
+QListWidget* PageView::list(const TextList& rows, std::function<void(int)> picked, Reading reading) {
+    QListWidget* made = listing(rows, std::move(reading));
+    made->setFocusPolicy(Qt::StrongFocus);
+    const auto taken = [made, picked = std::move(picked)](QListWidgetItem* item) { picked(made->row(item)); };
+    connect(made, &QListWidget::itemClicked, this, taken);
+    connect(made, &QListWidget::itemActivated, this, taken);
+    return made;
+}
+
 void PageView::bindName(QWidget* widget, const Caption& caption) {
     bind(nameOf(caption), widget, [&caption] { return caption.text; });
 }
@@ -274,6 +308,10 @@ void PageView::bind(const QString& name, QWidget* widget, const Caption& caption
     m_controls.push_back({name, widget, &caption, nullptr, {}});
 }
 
+void PageView::follow(QWidget* widget, const Caption& caption) {
+    m_controls.push_back({{}, widget, &caption, nullptr, {}});
+}
+
 void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
                           std::function<void()> clicked) {
     button->setCheckable(true);
@@ -293,11 +331,10 @@ void PageView::bindHidden(const QString& name, const Caption& caption) {
     m_controls.push_back({name, nullptr, &caption, nullptr, {}});
 }
 
-void PageView::bindList(const QString& name, const TextList& list, QWidget* widget,
-                        std::function<QString(const QString&)> row) {
+void PageView::bindList(const QString& name, const TextList& list, QWidget* widget, Reading reading) {
     if (widget)
         widget->setObjectName(name);
-    m_controls.push_back({name, widget, nullptr, &list, {}, std::move(row)});
+    m_controls.push_back({name, widget, nullptr, &list, {}, std::move(reading)});
 }
 
 void PageView::setDirectedIcon(QPushButton* button, Way way) {
@@ -313,9 +350,21 @@ void PageView::setIcon(QAbstractButton* button, const QString& icon, QColor colo
     setButtonIcon(button, m_theme, icon, colour);
 }
 
+void PageView::setIcon(QListWidgetItem* row, const QString& icon, QColor colour) {
+    row->setIcon(m_theme.icon(icon, m_theme.size(IconSize::Button), colour));
+}
+
 void PageView::speak(QWidget* widget, const QString& text) const {
     widget->setProperty("spoken", true);
     widget->setAccessibleName(text);
+}
+
+QImage loadedPicture(const Files& files, const QString& path) {
+    const auto file = files.drives().toHost(path);
+    if (!file)
+        return {};
+    const auto picture = loadPicture(*file);
+    return picture ? picture->image() : QImage();
 }
 
 } // namespace lumora

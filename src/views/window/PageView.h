@@ -13,18 +13,23 @@
 #include <QWidget>
 
 #include <functional>
+#include <type_traits>
+#include <utility>
 #include <vector>
 
 class QAbstractButton;
 class QCheckBox;
 class QComboBox;
 class QLineEdit;
+class QListWidget;
+class QListWidgetItem;
 class QPushButton;
 
 namespace lumora {
 
 class CardButton;
 class ChoiceCards;
+class Files;
 class Overlay;
 
 // The base of all views. A control is bound to the page's state under its design name: text, visible, enabled and hint
@@ -37,14 +42,16 @@ public:
 
     const Page& page() const { return m_page; }
 
+    // What a person reads where the page's text stands.
+    using Reading = std::function<QString(const QString&)>;
     // One control of the page, seen or not.
     struct Control {
         QString name;
         QPointer<QWidget> widget;         // null for what the page holds and nobody sees
         const Caption* caption = nullptr; // one of the two tells what the control says
         const TextList* list = nullptr;
-        std::function<QString()> text;                   // in place of the caption's
-        std::function<QString(const QString&)> row = {}; // what a person reads of a row of the list
+        std::function<QString()> text; // in place of the caption's
+        Reading reading = {};          // of a row of the list, or of the caption
     };
     const Control* control(const QString& name) const;
 
@@ -85,6 +92,9 @@ protected:
     }
     QLabel* label(const QString& name, const Caption& caption, const char* type = "body");
     QLabel* label(const Caption& caption, const char* type = "body") { return label(nameOf(caption), caption, type); }
+    QLabel* label(const Caption& caption, const char* type, Reading reading);
+    // Says the caption at a second place, without its name.
+    QLabel* echo(const Caption& caption, const char* type = "body");
     // A label that is never broken into lines.
     QLabel* lineLabel(const Caption& caption, const char* type = "body");
     QLineEdit* field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited);
@@ -105,6 +115,12 @@ protected:
     ChoiceCards* choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
                              std::function<CardButton*(int)> maker, std::function<void(int)> activated);
 
+    // A list to look at, and one whose rows answer to a touch and to Enter alike.
+    QListWidget* listing(const TextList& rows, Reading reading = {});
+    QListWidget* list(const TextList& rows, std::function<void(int)> picked, Reading reading = {});
+
+    // The widget shows where the caption does, and keeps no name.
+    void follow(QWidget* widget, const Caption& caption);
     // Binds a widget of the view's own making.
     void bind(const QString& name, QWidget* widget, const Caption& caption);
     void bind(QWidget* widget, const Caption& caption) { bind(nameOf(caption), widget, caption); }
@@ -119,10 +135,9 @@ protected:
     void bindName(QWidget* widget, const Caption& caption);
     // What has a name and is not seen, of a page whose controls carry no names.
     void bindHidden(const QString& name, const Caption& caption);
-    void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr,
-                  std::function<QString(const QString&)> row = {});
-    void bindList(QWidget* widget, const TextList& list, std::function<QString(const QString&)> row = {}) {
-        bindList(m_page.controls().nameOf(list), list, widget, std::move(row));
+    void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr, Reading reading = {});
+    void bindList(QWidget* widget, const TextList& list, Reading reading = {}) {
+        bindList(m_page.controls().nameOf(list), list, widget, std::move(reading));
     }
     QString nameOf(const Caption& caption) const { return m_page.controls().nameOf(caption); }
     // The icon of a button that points along the reading direction or against it.
@@ -130,6 +145,7 @@ protected:
     void setDirectedIcon(QPushButton* button, Way way);
 
     void setIcon(QAbstractButton* button, const QString& icon, QColor colour);
+    void setIcon(QListWidgetItem* row, const QString& icon, QColor colour);
 
     // A spoken meaning for a control whose text does not tell enough.
     void speak(QWidget* widget, const QString& text) const;
@@ -149,32 +165,37 @@ private:
     bool m_detached = false;
 };
 
-// The base of the view of one page.
-template <class P>
-class ViewOf : public PageView {
+// The base of the view of one page, whose controls are c.
+template <class P, class Base = PageView>
+class ViewOf : public Base {
 protected:
-    ViewOf(P& page, const SessionState& state, const Theme& theme)
-        : PageView(page, state, theme)
-        , m_page(page) {}
+    template <class... More>
+    ViewOf(P& page, const SessionState& state, const Theme& theme, const More&... more)
+        : Base(page, state, theme, more...)
+        , m_page(page)
+        , c(page.controls()) {}
 
     // A button that calls the page's handler, for one of an array with its index.
-    using PageView::button;
-    QPushButton* button(const QString& name, const Caption& caption, Role role, void (P::*clicked)(),
+    using Base::button;
+    QPushButton* button(const QString& name, const Caption& caption, PageView::Role role, void (P::*clicked)(),
                         const QString& icon = {}) {
-        return button(
-            name, caption, role, [&page = m_page, clicked] { (page.*clicked)(); }, icon);
+        return Base::button(name, caption, role, toPage(clicked), icon);
     }
-    QPushButton* button(const QString& name, const Caption& caption, Role role, void (P::*clicked)(int), int index,
-                        const QString& icon = {}) {
-        return button(
+    QPushButton* button(const QString& name, const Caption& caption, PageView::Role role, void (P::*clicked)(int),
+                        int index, const QString& icon = {}) {
+        return Base::button(
             name, caption, role, [&page = m_page, clicked, index] { (page.*clicked)(index); }, icon);
     }
-    QPushButton* button(const Caption& caption, Role role, void (P::*clicked)(), const QString& icon = {}) {
-        return button(nameOf(caption), caption, role, clicked, icon);
+    QPushButton* button(const Caption& caption, PageView::Role role, void (P::*clicked)(), const QString& icon = {}) {
+        return button(this->nameOf(caption), caption, role, clicked, icon);
     }
-    QPushButton* button(const Caption& caption, Role role, void (P::*clicked)(int), int index,
+    QPushButton* button(const Caption& caption, PageView::Role role, void (P::*clicked)(int), int index,
                         const QString& icon = {}) {
-        return button(nameOf(caption), caption, role, clicked, index, icon);
+        return button(this->nameOf(caption), caption, role, clicked, index, icon);
+    }
+    using Base::list;
+    QListWidget* list(const TextList& rows, void (P::*picked)(int), PageView::Reading reading = {}) {
+        return Base::list(rows, toPage(picked), std::move(reading));
     }
     // The page's handler as a function.
     auto toPage(void (P::*handler)()) const {
@@ -186,7 +207,11 @@ protected:
     }
 
     P& m_page;
+    const std::remove_cvref_t<decltype(std::declval<const P&>().controls())>& c;
 };
+
+// The picture at a drive path, null where there is none.
+QImage loadedPicture(const Files& files, const QString& path);
 
 // The control of an array: "Command4Snif(3)".
 inline QString numbered(const char* name, std::size_t index) {

@@ -24,7 +24,7 @@ void showStartFailure(const QString& text) {
     MessagePanel panel(theme, &window, MessagePanel::Kind::Message,
                        u"התוכנה אינה יכולה להתחיל · The program can't start"_s, u"\u2066%1\u2069"_s.arg(text),
                        {u"סגור · Close"_s});
-    panel.setCardWidth(780);
+    panel.setWidth(Overlay::Width::Wide);
     QEventLoop loop;
     QObject::connect(&panel, &MessagePanel::answered, &loop, &QEventLoop::quit);
     window.show();
