@@ -14,7 +14,7 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
     : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Sending);
     frame().content()->addLayout(
-        inRow(Space::Wide, {{makeOrders(), 4}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}, makeWays()}), 1);
+        inRow(Space::Wide, {{makeOrders(), 5}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}, makeWays()}), 1);
     makeBars();
     start();
 }
@@ -22,6 +22,7 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
 QWidget* MoogMeretView::makeOrders() {
     m_orders = list(c.List3, &MoogMeret::List3_Click,
                     [&page = m_page](const QString& name) { return page.orderRow(name).text; });
+    m_orders->setTextElideMode(Qt::ElideRight);
     const Card card = makeCard("card", Pad::Normal);
     bind(card.frame, c.Picture3);
     add(*card.column, {label(c.Label4Shalav1, "strong"),

@@ -59,7 +59,7 @@ QWidget* SpltFormView::makeCut() {
     QLineEdit* edit = field(c.Text2, toPage(&SpltForm::Text2_Change));
     edit->setLayoutDirection(Qt::LeftToRight);
     edit->setInputMethodHints(Qt::ImhDigitsOnly);
-    edit->setFixedWidth(theme().px(150));
+    edit->setFixedWidth(theme().size(Extent::Field));
     sizeTitle->setBuddy(edit);
     const Card card = makeCard("card", Pad::Normal);
     add(*card.column, {label(c.Label4Cut, "large"),

@@ -77,7 +77,7 @@ void ArrowStrip::paintEvent(QPaintEvent*) {
     QColor colour = Theme::Colour::Primary;
     // Faint where the way begins and ends, so that the return to its beginning is not seen.
     colour.setAlphaF(static_cast<float>(0.25 + 0.6 * std::sin(m_phase * std::numbers::pi)));
-    painter.setPen(QPen(colour, m_theme.px(3), Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+    painter.setPen(QPen(colour, m_theme.thick(), Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     const double top = at.top() + m_theme.px(6) + m_phase * m_theme.px(6);
     for (const int i : {-1, 0, 1}) {
         const double x = at.center().x() + i * arm * 4;
@@ -118,7 +118,7 @@ void AdvertisingPicture::paintEvent(QPaintEvent*) {
         QRectF box(QPointF(), QSizeF(m_picture.size()).scaled(size(), Qt::KeepAspectRatio));
         box.moveCenter(QRectF(rect()).center());
         QPainterPath corners;
-        corners.addRoundedRect(box, m_theme.px(12), m_theme.px(12));
+        corners.addRoundedRect(box, m_theme.gap(), m_theme.gap());
         painter.setClipPath(corners);
         const QImage scaled =
             m_picture.scaled((box.size() * ratio).toSize(), Qt::IgnoreAspectRatio, Qt::SmoothTransformation);

@@ -23,7 +23,7 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     makeStart();
     m_arrow = new ArrowStrip(theme, m_start, this);
     frame().content()->setSpacing(theme.size(Space::Tight));
-    frame().content()->setContentsMargins(theme.margin(), theme.px(14), theme.margin(), theme.size(Space::Tight));
+    frame().content()->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.size(Space::Tight));
     frame().content()->addWidget(m_arrow);
     makeShops();
 
@@ -146,7 +146,7 @@ void hatchalaView::makeStart() {
 // The question at which shop the prints are fetched.
 void hatchalaView::makeShops() {
     QListWidget* shops = list(c.List1, &hatchala::List1_Click);
-    shops->setFixedHeight(theme().px(130));
+    shops->setFixedHeight(theme().size(Extent::Drawing));
     m_shops = new Overlay(theme(), this,
                           {label(c.List1Caption, "title"),
                            shops,

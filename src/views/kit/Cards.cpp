@@ -38,7 +38,7 @@ void CardButton::paintEvent(QPaintEvent*) {
                                  !isEnabled()              ? Theme::Colour::Sunken
                                  : isChecked() || isDown() ? Theme::Colour::PrimarySoft
                                                            : Theme::Colour::Surface,
-                                 thick, m_theme.px(16));
+                                 thick, m_theme.size(Space::Wide));
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
     painter.setLayoutDirection(layoutDirection());
     const int inset = m_theme.gap();
@@ -85,9 +85,10 @@ void Tile::paintInside(QPainter& painter, const QRectF& room) {
     }
     const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
     const double disc = std::min<double>(theme().px(60), room.height() * 0.7);
-    const double gap = theme().px(16);
+    const double gap = theme().size(Space::Wide);
     QRectF mark(0, 0, disc, disc);
-    mark.moveCenter({rightToLeft ? room.right() - disc / 2 - theme().px(4) : room.left() + disc / 2 + theme().px(4),
+    mark.moveCenter({rightToLeft ? room.right() - disc / 2 - theme().size(Space::Tight)
+                                 : room.left() + disc / 2 + theme().size(Space::Tight),
                      room.center().y()});
     paintDisc(painter, mark);
 
@@ -103,14 +104,15 @@ void Tile::paintInside(QPainter& painter, const QRectF& room) {
     const QRectF headBox = QFontMetricsF(head).boundingRect(words, flags, text());
     const QRectF bodyBox =
         m_explanation.isEmpty() ? QRectF() : QFontMetricsF(body).boundingRect(words, flags, m_explanation);
-    const double between = m_explanation.isEmpty() ? 0 : theme().px(4);
+    const double between = m_explanation.isEmpty() ? 0 : theme().size(Space::Tight);
     double y = words.top() + std::max(0.0, (words.height() - headBox.height() - between - bodyBox.height()) / 2);
     painter.setFont(head);
     painter.drawText(QRectF(words.left(), y, words.width(), headBox.height() + 2), flags, text());
     y += headBox.height() + between;
     painter.setFont(body);
     painter.setPen(Theme::Colour::Muted);
-    painter.drawText(QRectF(words.left(), y, words.width(), words.bottom() - y + theme().px(8)), flags, m_explanation);
+    painter.drawText(QRectF(words.left(), y, words.width(), words.bottom() - y + theme().size(Space::Small)), flags,
+                     m_explanation);
 }
 
 void Tile::paintUpright(QPainter& painter, const QRectF& room) {
@@ -118,17 +120,18 @@ void Tile::paintUpright(QPainter& painter, const QRectF& room) {
     const int flags = Qt::TextWordWrap | Qt::AlignHCenter | Qt::AlignTop;
     const QFont head = theme().font(Theme::Type::Large);
     const QFont body = theme().font(Theme::Type::Body);
-    const QRectF words = room.adjusted(theme().px(4), 0, -theme().px(4), 0);
+    const QRectF words = room.adjusted(theme().size(Space::Tight), 0, -theme().size(Space::Tight), 0);
     const double headHeight = QFontMetricsF(head).boundingRect(words, flags, text()).height();
     const double bodyHeight =
         m_explanation.isEmpty() ? 0 : QFontMetricsF(body).boundingRect(words, flags, m_explanation).height();
-    double y = room.center().y() - (disc + theme().px(18) + headHeight + theme().px(6) + bodyHeight) / 2;
+    double y = room.center().y() -
+               (disc + theme().size(Space::Wide) + headHeight + theme().size(Space::Tight) + bodyHeight) / 2;
     const QRectF mark(room.center().x() - disc / 2, y, disc, disc);
     paintDisc(painter, mark);
-    y += disc + theme().px(18);
+    y += disc + theme().size(Space::Wide);
     painter.setFont(head);
     painter.drawText(QRectF(words.left(), y, words.width(), headHeight + 2), flags, text());
-    y += headHeight + theme().px(6);
+    y += headHeight + theme().size(Space::Tight);
     painter.setFont(body);
     painter.setPen(Theme::Colour::Muted);
     painter.drawText(QRectF(words.left(), y, words.width(), bodyHeight + 2), flags, m_explanation);
@@ -157,7 +160,7 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
     painter.restore();
     if (m_ribbon.isValid()) {
         // A bookmark on the side away from the mark of the choice.
-        const double width = theme().px(16);
+        const double width = theme().size(Space::Wide);
         const double top = room.top() - theme().gap();
         const double bottom = top + theme().px(34);
         const double left = layoutDirection() == Qt::RightToLeft ? room.right() - width : room.left();
@@ -166,7 +169,7 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
         painter.drawPolygon(QPolygonF{{left, top},
                                       {left + width, top},
                                       {left + width, bottom},
-                                      {left + width / 2, bottom - theme().px(8)},
+                                      {left + width / 2, bottom - theme().size(Space::Small)},
                                       {left, bottom}});
     }
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
@@ -175,8 +178,8 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
                                                         : Theme::Type::Strong));
     if (m_words == Words::Size)
         painter.setLayoutDirection(Qt::LeftToRight);
-    const int beside = small ? theme().px(8) : 0;
-    const int below = small ? theme().px(4) : 0;
+    const int beside = small ? theme().size(Space::Small) : 0;
+    const int below = small ? theme().size(Space::Tight) : 0;
     painter.drawText(line.adjusted(-beside, below, beside, below),
                      Qt::AlignCenter | (small ? static_cast<int>(Qt::TextWordWrap) : 0), text());
 }

@@ -59,7 +59,7 @@ void FocusRing::follow() {
         hide();
         return;
     }
-    const int around = m_theme.px(5);
+    const int around = m_theme.thick() + m_theme.hair();
     QRect seen = m_target->rect().translated(m_target->mapTo(window(), QPoint()));
     for (QWidget* parent = m_target->parentWidget(); parent && parent != window(); parent = parent->parentWidget())
         seen &= parent->rect().translated(parent->mapTo(window(), QPoint()));
@@ -71,7 +71,7 @@ void FocusRing::follow() {
 void FocusRing::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
-    const double thick = m_theme.px(3);
+    const double thick = m_theme.thick();
     painter.setPen(QPen(Qt::white, thick + 2));
     const QRectF ring = QRectF(rect()).adjusted(thick, thick, -thick, -thick);
     painter.drawRoundedRect(ring, m_theme.corner(), m_theme.corner());

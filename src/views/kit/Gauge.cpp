@@ -32,25 +32,26 @@ void Gauge::showSign(Mood mood) {
 }
 
 QSize Gauge::sizeHint() const {
-    return {m_theme.px(230), m_theme.px(230)};
+    return {m_theme.size(Extent::WideField), m_theme.size(Extent::WideField)};
 }
 
 QSize Gauge::minimumSizeHint() const {
-    return {m_theme.px(150), m_theme.px(150)};
+    return {m_theme.size(Extent::Field), m_theme.size(Extent::Field)};
 }
 
 void Gauge::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
-    const double thick = m_theme.px(14);
+    const double thick = m_theme.corner();
     const double side = std::min(width(), height()) - thick - 2;
     QRectF ring(0, 0, side, side);
     ring.moveCenter(QRectF(rect()).center());
-    const QColor colour = m_mood == Mood::Good      ? Theme::Colour::Good
-                          : m_mood == Mood::Bad     ? Theme::Colour::Danger
-                          : m_mood == Mood::Held    ? Theme::Colour::Edge
-                          : m_mood == Mood::Unclear ? Theme::Colour::Sun
-                                                    : Theme::Colour::Primary;
+    static const std::pair<QColor, QString> looks[] = {{Theme::Colour::Primary, {}}, // by Mood
+                                                       {Theme::Colour::Edge, u"pause"_s},
+                                                       {Theme::Colour::Sun, u"info"_s},
+                                                       {Theme::Colour::Good, u"tick"_s},
+                                                       {Theme::Colour::Danger, u"warning"_s}};
+    const auto& [colour, sign] = looks[static_cast<int>(m_mood)];
     painter.setPen(QPen(Theme::Colour::Sunken, thick));
     painter.drawEllipse(ring);
     painter.setPen(QPen(colour, thick, Qt::SolidLine, Qt::RoundCap));
@@ -58,28 +59,24 @@ void Gauge::paintEvent(QPaintEvent*) {
         painter.drawArc(ring, 90 * 16, -static_cast<int>(m_share * 360 * 16));
     if (m_mood != Mood::Busy) {
         const int size = static_cast<int>(side * 0.5);
-        const QString sign = m_mood == Mood::Good      ? u"tick"_s
-                             : m_mood == Mood::Bad     ? u"warning"_s
-                             : m_mood == Mood::Unclear ? u"info"_s
-                                                       : u"pause"_s;
         drawIcon(painter, ring.center(), m_theme.icon(sign, size, colour));
         return;
     }
     QFont font = m_theme.font(Theme::Type::Display);
     font.setPixelSize(m_theme.px(52));
     // "12 / 250" has to stay within the ring.
-    const double room = side - thick - m_theme.px(16);
+    const double room = side - thick - m_theme.size(Space::Wide);
     if (const int wide = QFontMetrics(font).horizontalAdvance(m_large); wide > room)
         font.setPixelSize(std::max(1, static_cast<int>(m_theme.px(52) * room / wide)));
     painter.setFont(font);
     painter.setPen(Theme::Colour::Ink);
-    const double lift = m_small.isEmpty() ? 0 : m_theme.px(14);
+    const double lift = m_small.isEmpty() ? 0 : m_theme.corner();
     painter.setLayoutDirection(Qt::LeftToRight);
     painter.drawText(ring.translated(0, -lift), Qt::AlignCenter, m_large);
     painter.setFont(m_theme.font(Theme::Type::Body));
     painter.setPen(Theme::Colour::Muted);
     painter.setLayoutDirection(layoutDirection());
-    painter.drawText(ring.translated(0, m_theme.px(28)), Qt::AlignCenter, m_small);
+    painter.drawText(ring.translated(0, m_theme.margin()), Qt::AlignCenter, m_small);
 }
 
 } // namespace lumora

@@ -42,17 +42,17 @@ void PaletteBar::paintEvent(QPaintEvent*) {
     painter.setRenderHint(QPainter::Antialiasing);
     const double step = fields() > 0 ? double(width()) / fields() : width();
     for (int field = 0; field < fields(); ++field) {
-        const double inset = m_theme.px(4);
+        const double inset = m_theme.size(Space::Tight);
         const QRectF box = QRectF(field * step, 0, step, height()).adjusted(inset, inset, -inset, -inset);
-        const double corner = m_theme.px(9);
+        const double corner = m_theme.size(Space::Small);
         const QColor colour(m_palette.pixel(field * m_palette.height(), 0));
         painter.setPen(QPen(Theme::Colour::Edge, 1));
         painter.setBrush(colour);
         painter.drawRoundedRect(box, corner, corner);
         if (field == chosenField()) {
-            painter.setPen(QPen(Theme::Colour::Primary, m_theme.px(3)));
+            painter.setPen(QPen(Theme::Colour::Primary, m_theme.thick()));
             painter.setBrush(Qt::NoBrush);
-            const double out = m_theme.px(2);
+            const double out = m_theme.hair();
             painter.drawRoundedRect(box.adjusted(-out, -out, out, out), corner, corner);
         }
     }

@@ -60,7 +60,7 @@ void ScrolledPicture::paintEvent(QPaintEvent*) {
 void ScrolledPicture::paintPicture(QPainter& painter) const {
     if (m_picture.isNull()) {
         drawIcon(painter, QRectF(viewport()->rect()).center(),
-                 m_theme.icon(u"document"_s, m_theme.px(64), Theme::Colour::Edge));
+                 m_theme.icon(u"document"_s, m_theme.size(IconSize::Page), Theme::Colour::Edge));
         return;
     }
     const double scale = m_theme.factor();

@@ -36,6 +36,11 @@ int Theme::size(IconSize sign) const {
     return px(pixels[static_cast<int>(sign)]);
 }
 
+int Theme::size(Extent extent) const {
+    static constexpr int pixels[] = {120, 150, 230, 360, 680};
+    return px(pixels[static_cast<int>(extent)]);
+}
+
 QMargins Theme::margins(Pad pad) const {
     static constexpr QSize pixels[] = {{8, 6}, {16, 10}, {18, 14}, {30, 22}};
     const QSize room = pixels[static_cast<int>(pad)];

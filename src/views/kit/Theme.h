@@ -21,6 +21,9 @@ enum class Pad { Tight, Slim, Normal, Wide };
 // The side of an icon: of a small key, of a button, at a line of words, of a box, of an empty page.
 enum class IconSize { Small, Button, Line, Box, Page };
 
+// The extent of what has a size of its own: a small drawing, a short field, a wide one, a bar, a form.
+enum class Extent { Drawing, Field, WideField, Bar, Form };
+
 // The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
 class Theme {
 public:
@@ -61,6 +64,7 @@ public:
 
     int size(Space space) const;
     int size(IconSize sign) const;
+    int size(Extent extent) const;
     QMargins margins(Pad pad) const;
     int gap() const { return size(Space::Normal); }
     int margin() const { return size(Space::Far); } // of a page

@@ -1,8 +1,9 @@
 #include "views/kyoskNew/LargePicture.h"
 
+#include "views/kit/Painting.h"
+
 #include <QKeyEvent>
 #include <QMouseEvent>
-#include <QPainter>
 
 #include <utility>
 
@@ -13,7 +14,7 @@ using namespace Qt::StringLiterals;
 LargePicture::LargePicture(const Theme& theme, QWidget* parent)
     : QWidget(parent)
     , m_theme(theme) {
-    setMinimumSize(theme.px(180), theme.px(120));
+    setMinimumSize(theme.size(Extent::Field), theme.size(Extent::Drawing));
 }
 
 void LargePicture::show(const LargeView& view) {
@@ -59,45 +60,45 @@ void LargePicture::paintEvent(QPaintEvent*) {
         painter.setPen(Theme::Colour::Ink);
         painter.setLayoutDirection(layoutDirection());
         painter.setFont(m_theme.font(Theme::Type::Body));
-        const int sign = m_theme.px(44);
-        QRect words = rect().adjusted(0, sign + m_theme.px(20), 0, 0);
+        const int sign = m_theme.size(IconSize::Box);
+        QRect words = rect().adjusted(0, sign + m_theme.size(Space::Wide), 0, 0);
         if (painter.boundingRect(words, flags, lines.join(u'\n')).height() > words.height()) {
             painter.setFont(m_theme.font(Theme::Type::Small)); // little room: the words alone, and smaller
             words = rect();
         } else {
-            painter.drawPixmap(QPoint((width() - sign) / 2, m_theme.px(10)),
+            painter.drawPixmap(QPoint((width() - sign) / 2, m_theme.size(Space::Small)),
                                m_theme.icon(u"info"_s, sign, Theme::Colour::Primary));
         }
         painter.drawText(words, flags, lines.join(u'\n'));
         return;
     }
     const QImage& picture = m_view.bitmap.image();
-    const QSizeF fit = QSizeF(picture.size()).scaled(size(), Qt::KeepAspectRatio);
-    QRectF at(QPointF(), fit);
-    at.moveCenter(QRectF(rect()).center());
+    const QRectF at = fitted(rect(), picture.size());
     painter.drawImage(at, picture);
-    const int sign = m_theme.px(34);
-    const QRectF plate(at.right() - sign - m_theme.px(8), at.bottom() - sign - m_theme.px(8), sign, sign);
+    const double radius = m_theme.size(Space::Wide);
+    const double in = radius + m_theme.size(Space::Small);
+    const QPointF plate(at.right() - in, at.bottom() - in);
     painter.setPen(Qt::NoPen);
     painter.setBrush(QColor(255, 255, 255, 215));
-    painter.drawEllipse(plate);
-    const int inset = m_theme.px(6);
-    painter.drawPixmap(plate.topLeft() + QPointF(inset, inset),
-                       m_theme.icon(u"look"_s, sign - 2 * inset, Theme::Colour::Ink));
+    painter.drawEllipse(plate, radius, radius);
+    drawIcon(painter, plate, m_theme.icon(u"look"_s, m_theme.size(IconSize::Small), Theme::Colour::Ink));
     if (!m_view.poor)
         return;
     painter.setFont(m_theme.font(Theme::Type::Small));
-    const int icon = m_theme.px(22);
-    const QRectF room(at.left(), at.top(), at.width(), m_theme.px(48));
-    painter.fillRect(room, QColor(0xFD, 0xF0, 0xD9, 235));
+    const int icon = m_theme.size(IconSize::Button);
+    const int edge = m_theme.size(Space::Small);
+    const QRectF room(at.left(), at.top(), at.width(), m_theme.target());
+    QColor veil = Theme::Colour::SunSoft;
+    veil.setAlpha(235);
+    painter.fillRect(room, veil);
     const bool rightToLeft = layoutDirection() == Qt::RightToLeft;
-    painter.drawPixmap(QPointF(rightToLeft ? room.right() - icon - m_theme.px(8) : room.left() + m_theme.px(8),
-                               room.center().y() - icon / 2.0),
-                       m_theme.icon(u"warning"_s, icon, Theme::Colour::Danger));
+    const double middle = edge + icon / 2.0;
+    drawIcon(painter, {rightToLeft ? room.right() - middle : room.left() + middle, room.center().y()},
+             m_theme.icon(u"warning"_s, icon, Theme::Colour::Danger));
     painter.setPen(Theme::Colour::Ink);
     painter.setLayoutDirection(layoutDirection());
-    const int beside = icon + m_theme.px(14);
-    painter.drawText(room.adjusted(rightToLeft ? m_theme.px(6) : beside, 0, rightToLeft ? -beside : -m_theme.px(6), 0),
+    const int beside = icon + 2 * edge;
+    painter.drawText(room.adjusted(rightToLeft ? edge : beside, 0, rightToLeft ? -beside : -edge, 0),
                      Qt::AlignVCenter | Qt::AlignLeading | Qt::TextWordWrap, m_view.warning);
 }
 

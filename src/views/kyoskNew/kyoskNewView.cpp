@@ -152,7 +152,8 @@ void kyoskNewView::makeBars() {
                               button(c.Image10, Role::Quiet, &kyoskNew::Image10_Click, u"exit"_s)});
     frame().addSecondaryActions({button(c.Image5, Role::Secondary, &kyoskNew::Image5_Click, u"folder-plus"_s),
                                  button(c.Image8, Role::Quiet, &kyoskNew::Image8_Click, u"eraser"_s)});
-    frame().addStatus({lineLabel(c.Label7Prompt), lineLabel(c.Label7, "title"), lineLabel(c.Label15, "muted")});
+    frame().addStatus(
+        {lineLabel(c.Label7Prompt), lineLabel(c.Label7, "title"), Space::Tight, lineLabel(c.Label15, "muted")});
     frame().addMainActions({button(c.Image13, Role::Main, &kyoskNew::Image13_Click),
                             button(c.Image7, Role::Main, &kyoskNew::Image7_Click)});
 }
@@ -190,9 +191,7 @@ void kyoskNewView::makeClosingPanel() {
                              lineLabel(c.Label19Prompt, "muted"), lineLabel(c.Label19, "title"), Item::room()}));
     m_closing = new Overlay(
         theme(), this,
-        {inRow(Space::Normal, {{label(c.closingHead, "title"), 1},
-                               prices}),
-         facts.frame,
+        {inRow(Space::Normal, {{label(c.closingHead, "title"), 1}, prices}), facts.frame,
          inRow(Space::Small, {lineLabel(c.Label4kpn3Prompt, "muted"), lineLabel(c.Label4kpn3, "strong"), Item::room()}),
          inRow(Space::Small, {label(c.Label17, "strong"), lineLabel(c.Label33, "danger"), Item::room()}),
          // An address runs from left to right in both languages.
@@ -308,8 +307,8 @@ void kyoskNewView::renderFolder() {
     const QString folder = c.Label29.text.trimmed();
     QString line;
     if (!folder.isEmpty())
-        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().px(200))) + u"  ·  "_s +
-               c.pictureCount.text;
+        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().size(Extent::WideField))) +
+               u"  ·  "_s + c.pictureCount.text;
     m_folder->setText(line);
 }
 

@@ -92,7 +92,7 @@ void drawPaper(QPainter& painter, const QRectF& paper, PaperFinish finish) {
 void drawExtra(QPainter& painter, const QRectF& box, AlbumDrawing what, const Theme& theme) {
     if (what == AlbumDrawing::Nothing) {
         const double radius = box.height() * 0.32;
-        painter.setPen(QPen(Theme::Colour::Edge, theme.px(5), Qt::SolidLine, Qt::RoundCap));
+        painter.setPen(QPen(Theme::Colour::Edge, theme.size(Space::Tight), Qt::SolidLine, Qt::RoundCap));
         painter.setBrush(Qt::NoBrush);
         painter.drawEllipse(box.center(), radius, radius);
         painter.drawLine(box.center() + QPointF(-radius * 0.7, radius * 0.7),
@@ -122,22 +122,22 @@ void drawExtra(QPainter& painter, const QRectF& box, AlbumDrawing what, const Th
         painter.setClipPath(plate);
         drawSamplePicture(painter, box);
         painter.restore();
-        painter.setPen(QPen(QColor(0xB9, 0xBE, 0xC4), theme.px(5)));
+        painter.setPen(QPen(QColor(0xB9, 0xBE, 0xC4), theme.size(Space::Tight)));
         painter.setBrush(Qt::NoBrush);
         painter.drawRoundedRect(box, corner, corner);
     } else {
         drawSamplePicture(painter, box);
         painter.fillRect(box, QColor(255, 255, 255, 45));
-        painter.setPen(QPen(QColor(255, 255, 255, 180), theme.px(3)));
+        painter.setPen(QPen(QColor(255, 255, 255, 180), theme.thick()));
         painter.setBrush(Qt::NoBrush);
-        painter.drawRect(box.adjusted(theme.px(3), theme.px(3), -theme.px(3), -theme.px(3)));
+        painter.drawRect(box.adjusted(theme.thick(), theme.thick(), -theme.thick(), -theme.thick()));
         // The four bolts that hold it off the wall.
         const double in = box.height() * 0.14;
         for (const QPointF& at : {box.topLeft() + QPointF(in, in), box.topRight() + QPointF(-in, in),
                                   box.bottomLeft() + QPointF(in, -in), box.bottomRight() + QPointF(-in, -in)}) {
             painter.setPen(QPen(Theme::Colour::Edge, 1));
             painter.setBrush(QColor(0xDD, 0xE2, 0xE6));
-            painter.drawEllipse(at, theme.px(5), theme.px(5));
+            painter.drawEllipse(at, theme.size(Space::Tight), theme.size(Space::Tight));
         }
         drawThinLine(painter, box);
     }

@@ -74,7 +74,7 @@ void nnnView::placeTiles() {
 
 QWidget* nnnView::makeDetails() {
     const Card form = makeCard("card", Pad::Wide, Space::Tight);
-    form.frame->setMinimumWidth(theme().px(720));
+    form.frame->setMinimumWidth(theme().size(Extent::Form));
     const auto line = [&](const Caption& caption, const Caption& head, void (nnn::*changed)(const QString&)) {
         QLabel* title = label(head, "strong");
         QLineEdit* box = field(caption, toPage(changed));
@@ -104,7 +104,7 @@ QWidget* nnnView::makeOptions() {
         sizes->addWidget(card, 2);
     }
     m_moreSizes = comboBox(c.Combo1.rows, c.Combo1, toPage(&nnn::Combo1_Click));
-    m_moreSizes->setMinimumWidth(theme().px(220));
+    m_moreSizes->setMinimumWidth(theme().size(Extent::WideField));
     sizes->addLayout(inColumn(Space::Normal, {Item::room(), m_moreSizes, label(c.Label4kpn, "muted"), Item::room()}),
                      2);
     auto* kinds = inRow(Space::Wide);
@@ -143,7 +143,7 @@ QWidget* nnnView::makeBorders() {
     }
     const Card preview = makeCard("card", Pad::Normal);
     m_sample = new BorderSample(preview.frame);
-    m_sample->setMinimumSize(theme().px(240), theme().px(200));
+    m_sample->setMinimumSize(theme().size(Extent::WideField), theme().size(Extent::Field));
     bind(u"Picture16"_s, m_sample, [this] { return QString::number(c.Picture16); });
     add(*preview.column, {{m_sample, 1}, centred(label(c.LabelPicture16, "strong"))});
     QWidget* step = inBox(inRow(Space::Far, {{grid, 3}, {preview.frame, 1}}));
@@ -178,7 +178,7 @@ QWidget* nnnView::makeTerms() {
     m_chosen = words("large");
     add(*summary.column, {label(c.LabelChoice, "muted"), m_chosen});
     const Card terms = makeCard("card", Pad::Wide);
-    terms.frame->setMinimumWidth(theme().px(640));
+    terms.frame->setMinimumWidth(theme().size(Extent::Form));
     QLayout* row = inRow(Space::Normal, {checkBox(c.Check1, toPage(&nnn::Check1_Click)), Item::room(),
                                          button(c.Command29, Role::Plain, &nnn::Command29_Click, u"document"_s)});
     const Card hint = makeCard("notice", Pad::Slim);

@@ -115,14 +115,14 @@ QWidget* nnnView::Album::makeParents() {
     QLabel* count = m_view.label(m_shown.Label32, "title");
     count->setWordWrap(false);
     count->setAlignment(Qt::AlignCenter);
-    count->setMinimumWidth(m_theme.px(36));
+    count->setMinimumWidth(m_theme.target());
     // The minus stands left and the plus right in both languages.
     m_copies = leftToRight(inRow(Space::Normal, {m_less, count, m_more}));
     QLabel* prompt = m_view.label(m_shown.LabelParents, "muted");
     prompt->setWordWrap(false);
     m_parentSize =
         m_view.comboBox(m_shown.Combo4Horim.rows, m_shown.Combo4Horim, toAlbum(&AlbumPanels::Combo4Horim_Click));
-    m_parentSize->setMinimumWidth(m_theme.px(240));
+    m_parentSize->setMinimumWidth(m_theme.size(Extent::WideField));
     const Card card = makeCard("card", Pad::Slim);
     m_parents = card.frame;
     m_parents->setMinimumHeight(m_theme.target() + 2 * m_theme.gap());

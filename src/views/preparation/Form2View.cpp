@@ -11,7 +11,7 @@ using namespace Qt::StringLiterals;
 Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme, page.controls().Label1, page.controls().Label6, page.controls().Label10) {
     m_removed = listing(c.List4removed, LeafName);
-    m_removed->setMaximumHeight(theme.px(110));
+    m_removed->setMaximumHeight(theme.size(Extent::Drawing));
     add(*trouble().column, {label(c.Label4removed, "strong"), m_removed});
     m_list = list(c.List1, &Form2::List1_Click, LeafName);
     const Card lines = makeCard("card", Pad::Slim);

@@ -41,7 +41,7 @@ PreparationView::PreparationView(PreparationPage& page, const SessionState& stat
 
 PictureBox* PreparationView::pictureBox() {
     auto* made = new PictureBox(theme(), this);
-    made->setMinimumHeight(theme().px(150));
+    made->setMinimumHeight(theme().size(Extent::Field));
     return made;
 }
 

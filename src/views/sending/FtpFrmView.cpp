@@ -30,7 +30,7 @@ void FtpFrmView::makeProgress() {
     m_pieces = new QProgressBar(this);
     m_pieces->setRange(0, FtpFrmControls::Pic4ProgWidth);
     m_pieces->setTextVisible(false);
-    m_pieces->setFixedWidth(theme().px(360));
+    m_pieces->setFixedWidth(theme().size(Extent::Bar));
     bind(u"PicInProgKatan"_s, m_pieces,
          [this] { return u"%1 %"_s.arg(c.PicInProgKatanWidth * 100 / FtpFrmControls::Pic4ProgWidth); });
     QWidget* minutes = inBox(
@@ -69,7 +69,7 @@ QLayout* FtpFrmView::makeSide() {
         {inRow(Space::Small, {sign(u"document"_s, IconSize::Line), {label(c.Label4Summary, "large"), 1}}), m_summary});
 
     m_proof = new PictureBox(theme(), this);
-    m_proof->setMinimumHeight(theme().px(120));
+    m_proof->setMinimumHeight(theme().size(Extent::Drawing));
     bind(m_proof, c.Picture13);
     QPushButton* fault = button(c.Command22, Role::Plain, &FtpFrm::Command22_Click, u"resend"_s);
     QPushButton* details = button(c.Command24, Role::Quiet, &FtpFrm::Command24_Click, u"info"_s);

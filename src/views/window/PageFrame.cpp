@@ -16,7 +16,7 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     auto* mark = new QLabel(header);
     mark->setPixmap(theme.icon(u"lumora"_s, theme.px(38), Theme::Colour::Primary));
     auto* headerRow = inRow(Space::Normal, {mark, name, {m_steps, 1}, m_headerActions});
-    headerRow->setContentsMargins(theme.margin(), theme.px(8), theme.margin(), theme.px(6));
+    headerRow->setContentsMargins(theme.margin(), theme.size(Space::Small), theme.margin(), theme.size(Space::Small));
     header->setLayout(headerRow);
     m_header = header;
 
@@ -29,7 +29,7 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
 
     m_content = inColumn(Space::Normal);
     auto* body = new QWidget(this);
-    m_content->setContentsMargins(theme.margin(), theme.px(14), theme.margin(), theme.px(14));
+    m_content->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.gap());
     body->setLayout(m_content);
 
     m_secondary = inRow(Space::Normal);

@@ -37,14 +37,15 @@ public:
         painter->save();
         const bool chosen = option.state & QStyle::State_Selected;
         const bool focused = option.state & QStyle::State_HasFocus;
-        const int inset = m_theme.px(6);
+        const int inset = m_theme.size(Space::Tight);
         const QRectF cell = drawCard(*painter, option.rect.adjusted(inset, inset, -inset, -inset),
                                      chosen    ? Theme::Colour::Primary
                                      : focused ? Theme::Colour::Focus
                                                : Theme::Colour::Line,
                                      chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
                                      chosen || focused ? m_theme.thick() : 1, m_theme.corner());
-        const QRectF box = cell.adjusted(m_theme.px(10), m_theme.px(10), -m_theme.px(10), -m_theme.px(36));
+        const QRectF box = cell.adjusted(m_theme.size(Space::Small), m_theme.size(Space::Small),
+                                         -m_theme.size(Space::Small), -m_theme.px(36));
         const QImage picture = index.data(PictureRole).value<QImage>();
         if (!picture.isNull()) {
             drawImage(*painter, box, picture);
@@ -60,8 +61,8 @@ public:
         }
         painter->setFont(m_theme.font(Theme::Type::Small));
         painter->setPen(Theme::Colour::Ink);
-        const QRectF line(cell.left() + m_theme.px(8), cell.bottom() - m_theme.px(32), cell.width() - m_theme.px(16),
-                          m_theme.px(26));
+        const QRectF line(cell.left() + m_theme.size(Space::Small), cell.bottom() - m_theme.px(32),
+                          cell.width() - m_theme.size(Space::Small) * 2, m_theme.px(26));
         const QString name = painter->fontMetrics().elidedText(index.data(Qt::DisplayRole).toString(), Qt::ElideMiddle,
                                                                static_cast<int>(line.width()));
         painter->drawText(line, Qt::AlignCenter, name);
@@ -127,58 +128,79 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     setObjectName(u"picturePicker"_s);
     setAccessibleName(title.isEmpty() ? prompt : title);
     setFilling();
-
-    QLabel* head = words("title", isolated(prompt.trimmed()));
-    head->setObjectName(u"pickerPrompt"_s);
-    QLabel* guide = words(
-        "muted",
-        isolated(
-            everyFile()
-                ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
-                : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
-                                u"Select only one image of a folder and the program will show you all the images"_s)));
-    guide->setObjectName(u"pickerGuide"_s);
-    add(*column(), {head, guide});
-
-    QVBoxLayout* side =
-        inColumn(Space::Small,
-                 {words("smallMuted", everyFile() ? state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
-                                                  : state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s))});
+    const auto named = [](QLabel* label, const QString& name) {
+        label->setObjectName(name);
+        return label;
+    };
+    const QString guide =
+        everyFile()
+            ? state.wording(u"לחיצה פותחת תיקייה ובוחרת קובץ"_s, u"A press opens a folder and chooses a file"_s)
+            : state.wording(u"יש לבחור רק תמונה אחת מתוך תקייה והתוכנה תציג לפניך את כל התמונות"_s,
+                            u"Select only one image of a folder and the program will show you all the images"_s);
+    add(*column(), {named(words("title", isolated(prompt.trimmed())), u"pickerPrompt"_s),
+                    named(words("muted", isolated(guide)), u"pickerGuide"_s)});
     m_places = places(initialFolder);
+    QLayout* side = makePlaces();
+    m_up = wordButton(u"pickerUp"_s, "plain", state.wording(u"תיקייה מעל"_s, u"Folder above"_s),
+                      [this] { open(m_folder.parent_path()); });
+    setButtonIcon(m_up, theme, u"folder-up"_s, Theme::Colour::Ink);
+    m_where = oneLine("strong");
+    makeGrid();
+    addRow({side, {inColumn(Space::Small, {inRow(Space::Normal, {m_up, {m_where, 1}}), {m_grid, 1}}), 1}}, Space::Far);
+    column()->setStretch(column()->count() - 1, 1);
+    const auto cancel = [this] { Q_EMIT finished({}); };
+    QPushButton* back = wordButton(u"pickerCancel"_s, "secondary", state.wording(u"ביטול"_s, u"Cancel"_s), cancel);
+    m_take = wordButton(u"pickerTake"_s, "main",
+                        everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
+                                    : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
+                        [this] { take(); });
+    addButtons(back, m_take);
+    whenEscaped(cancel);
+    setFirstFocus(m_grid);
+    m_reader.setInterval(0);
+    connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
+    open(firstFolder(initialFolder));
+}
+
+QLayout* PicturePicker::makePlaces() {
+    QVBoxLayout* side = inColumn(
+        Space::Small,
+        {words("smallMuted", everyFile() ? m_state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
+                                         : m_state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s))});
     for (std::size_t i = 0; i < m_places.size(); ++i) {
         const Place& place = m_places[i];
-        QPushButton* button = plainButton(u"place(%1)"_s.arg(i), "plain", [this, i] { open(m_places[i].folder); });
-        setButtonIcon(button, theme, place.icon, Theme::Colour::Primary);
-        button->setText(
-            QChar(0xA0) +
-            button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, theme.px(130)).replace(u'&', u"&&"_s));
+        QPushButton* button =
+            wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(m_places[i].folder); });
+        setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
+        const int room = m_theme.size(Extent::Field);
+        button->setText(QChar(0xA0) +
+                        button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, room).replace(u'&', u"&&"_s));
         button->setToolTip(toText(place.folder));
-        button->setAccessibleName(place.name);
         button->setCheckable(true);
-        button->setFixedWidth(theme.px(210));
+        button->setFixedWidth(m_theme.size(Extent::WideField));
         m_placeButtons.push_back(button);
         side->addWidget(button);
     }
     side->addStretch(1);
+    return side;
+}
 
-    const auto named = [&](const QString& name, const char* role, const QString& text, std::function<void()> clicked) {
-        QPushButton* button = plainButton(name, role, std::move(clicked));
-        button->setText(text);
-        button->setAccessibleName(text);
-        return button;
-    };
-    m_up = named(u"pickerUp"_s, "plain", state.wording(u"תיקייה מעל"_s, u"Folder above"_s),
-                 [this] { open(m_folder.parent_path()); });
-    setButtonIcon(m_up, theme, u"folder-up"_s, Theme::Colour::Ink);
-    m_where = oneLine("strong");
+QPushButton* PicturePicker::wordButton(const QString& name, const char* role, const QString& text,
+                                       std::function<void()> clicked) const {
+    QPushButton* button = plainButton(name, role, std::move(clicked));
+    button->setText(text);
+    button->setAccessibleName(text);
+    return button;
+}
 
+void PicturePicker::makeGrid() {
     auto* grid = new Grid(this);
     grid->up = [this] { m_up->click(); };
     m_grid = grid;
     m_grid->setObjectName(u"pickerGrid"_s);
-    m_grid->setAccessibleName(everyFile() ? state.wording(u"תיקיות וקבצים"_s, u"Folders and files"_s)
-                                          : state.wording(u"תיקיות ותמונות"_s, u"Folders and pictures"_s));
-    m_grid->setItemDelegate(new CellPainter(theme, m_grid));
+    m_grid->setAccessibleName(everyFile() ? m_state.wording(u"תיקיות וקבצים"_s, u"Folders and files"_s)
+                                          : m_state.wording(u"תיקיות ותמונות"_s, u"Folders and pictures"_s));
+    m_grid->setItemDelegate(new CellPainter(m_theme, m_grid));
     m_grid->setViewMode(QListView::IconMode);
     m_grid->setMovement(QListView::Static);
     m_grid->setResizeMode(QListView::Adjust);
@@ -195,34 +217,19 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
         const QListWidgetItem* item = m_grid->currentItem();
         m_take->setEnabled(item && item->isSelected() && !item->data(FolderRole).toBool());
     });
-    m_empty = words("muted");
-    m_empty->setAlignment(Qt::AlignCenter);
+    m_empty = centred(words("muted"));
     m_empty->setAttribute(Qt::WA_TransparentForMouseEvents);
     m_grid->setLayout(inColumn(Space::None, {m_empty}));
-    addRow({side, {inColumn(Space::Small, {inRow(Space::Normal, {m_up, {m_where, 1}}), {m_grid, 1}}), 1}}, Space::Far);
-    column()->setStretch(column()->count() - 1, 1);
+}
 
-    QPushButton* cancel =
-        named(u"pickerCancel"_s, "secondary", state.wording(u"ביטול"_s, u"Cancel"_s), [this] { Q_EMIT finished({}); });
-    m_take = named(u"pickerTake"_s, "main",
-                   everyFile() ? state.wording(u"בחר קובץ זה"_s, u"Take this file"_s)
-                               : state.wording(u"בחר תמונה זו"_s, u"Take this picture"_s),
-                   [this] { take(); });
-    addButtons(cancel, m_take);
-
-    whenEscaped([this] { Q_EMIT finished({}); });
-    m_reader.setInterval(0);
-    connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
-    setFirstFocus(m_grid);
+HostPath PicturePicker::firstFolder(const QString& initialFolder) const {
     std::error_code absent;
     if (const auto initial = m_files.drives().toHost(initialFolder);
-        everyFile() && initial && std::filesystem::is_directory(*initial, absent)) {
-        open(*initial);
-        return;
-    }
+        everyFile() && initial && std::filesystem::is_directory(*initial, absent))
+        return *initial;
     const auto first =
         std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
-    open(first != m_places.end() ? first->folder : m_places.front().folder);
+    return (first != m_places.end() ? *first : m_places.front()).folder;
 }
 
 std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFolder) const {
@@ -267,14 +274,12 @@ void PicturePicker::open(const HostPath& folder) {
     m_grid->clear();
     m_take->setEnabled(false);
     m_up->setEnabled(folder.has_relative_path());
-    std::size_t best = m_places.size();
+    for (QPushButton* button : m_placeButtons)
+        button->setChecked(false);
     for (std::size_t i = 0; i < m_places.size(); ++i) {
         if (m_places[i].folder == folder)
-            best = i;
-        m_placeButtons[i]->setChecked(false);
+            m_placeButtons[i]->setChecked(true);
     }
-    if (best < m_places.size())
-        m_placeButtons[best]->setChecked(true);
     m_where->setText(fromLeft(m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480))));
     m_where->setToolTip(toText(folder));
 
@@ -343,7 +348,7 @@ void PicturePicker::readNext() {
     QListWidgetItem* item = m_grid->item(*next);
     m_unread.erase(next);
     const HostPath path(item->data(PathRole).toByteArray().toStdString());
-    const int side = m_theme.px(150);
+    const int side = m_theme.size(Extent::Field);
     if (const auto size = readPictureSize(path)) {
         const QSize fit = QSize(size->width, size->height).scaled(side, side, Qt::KeepAspectRatio).expandedTo({1, 1});
         if (const auto picture = loadPictureScaled(path, {fit.width(), fit.height()})) {

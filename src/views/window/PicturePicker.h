@@ -11,10 +11,6 @@
 #include <deque>
 #include <vector>
 
-class QLabel;
-class QPushButton;
-class QVBoxLayout;
-
 namespace lumora {
 
 class Files;
@@ -43,6 +39,11 @@ private:
     };
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
     std::vector<Place> places(const QString& initialFolder) const;
+    HostPath firstFolder(const QString& initialFolder) const;
+    QLayout* makePlaces();
+    void makeGrid();
+    QPushButton* wordButton(const QString& name, const char* role, const QString& text,
+                            std::function<void()> clicked) const;
     void open(const HostPath& folder);
     void activate(const QListWidgetItem* item);
     void take();

@@ -48,18 +48,18 @@ void StepBar::paintEvent(QPaintEvent*) {
         return;
     const int current = static_cast<int>(m_step);
     const double slot = width() / static_cast<double>(count);
-    const double radius = m_theme.px(13);
+    const double radius = m_theme.corner();
     const double y = m_theme.px(22);
     const auto centre = [&](int i) {
         const double along = slot * (i + 0.5);
         return QPointF(layoutDirection() == Qt::RightToLeft ? width() - along : along, y);
     };
     for (int i = 0; i + 1 < count; ++i) {
-        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.px(3), Qt::SolidLine,
+        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.thick(), Qt::SolidLine,
                             Qt::RoundCap));
         const QPointF a = centre(i);
         const QPointF b = centre(i + 1);
-        const double inset = (b.x() > a.x() ? 1 : -1) * (radius + m_theme.px(7));
+        const double inset = (b.x() > a.x() ? 1 : -1) * (radius + m_theme.size(Space::Small));
         painter.drawLine(QPointF(a.x() + inset, y), QPointF(b.x() - inset, y));
     }
     for (int i = 0; i < count; ++i) {
@@ -69,13 +69,13 @@ void StepBar::paintEvent(QPaintEvent*) {
         if (here) {
             painter.setPen(Qt::NoPen);
             painter.setBrush(Theme::Colour::PrimarySoft);
-            painter.drawEllipse(at, radius + m_theme.px(5), radius + m_theme.px(5));
+            painter.drawEllipse(at, radius + m_theme.size(Space::Tight), radius + m_theme.size(Space::Tight));
         }
-        painter.setPen(QPen(done || here ? Theme::Colour::Primary : Theme::Colour::Edge, m_theme.px(2)));
+        painter.setPen(QPen(done || here ? Theme::Colour::Primary : Theme::Colour::Edge, m_theme.hair()));
         painter.setBrush(done || here ? Theme::Colour::Primary : Theme::Colour::Surface);
         painter.drawEllipse(at, radius, radius);
         if (done) {
-            drawIcon(painter, at, m_theme.icon(u"tick"_s, m_theme.px(18), Qt::white));
+            drawIcon(painter, at, m_theme.icon(u"tick"_s, m_theme.size(IconSize::Small), Qt::white));
         } else {
             painter.setFont(m_theme.font(Theme::Type::Small));
             painter.setPen(here ? QColor(Qt::white) : Theme::Colour::Muted);
