@@ -6,6 +6,7 @@
 #include <QRegularExpression>
 
 #include <algorithm>
+#include <optional>
 
 namespace lumora {
 
@@ -44,60 +45,84 @@ QString frameOfBorder(const QString& paperBorderCode) {
 
 namespace {
 
+namespace R = EditRecord;
+
+struct GainField {
+    R::Column column;
+    float EditFields::*field;
+};
+constexpr GainField gainFields[] = {
+    {R::GainR, &EditFields::GainR}, {R::GainG, &EditFields::GainG}, {R::GainB, &EditFields::GainB}};
+
+struct NumberField {
+    R::Column column;
+    std::int16_t EditFields::*field;
+    std::optional<std::int16_t> damaged =
+        {}; // the value of a column that has letters for a number; else they read as 0
+};
+constexpr NumberField numberFields[] = {{R::RotationCode, &EditFields::RotationCode, 180},
+                                        {R::ZoomPercent, &EditFields::ZoomPercent, 100},
+                                        {R::PanX, &EditFields::PanX, 999},
+                                        {R::PanY, &EditFields::PanY, 999},
+                                        {R::ToneFlag, &EditFields::ToneFlag},
+                                        {R::SpareFlag, &EditFields::SpareFlag},
+                                        {R::TextFontSize, &EditFields::TextFontSize},
+                                        {R::TextAlign, &EditFields::TextAlign},
+                                        {R::TextOn, &EditFields::TextOn},
+                                        {R::TextBlue, &EditFields::TextBlue},
+                                        {R::TextGreen, &EditFields::TextGreen},
+                                        {R::TextRed, &EditFields::TextRed},
+                                        {R::TextX, &EditFields::TextX},
+                                        {R::TextY, &EditFields::TextY},
+                                        {R::TextVertical, &EditFields::TextVertical},
+                                        {R::TextStyle, &EditFields::TextStyle}};
+
+struct TextField {
+    R::Column column;
+    QString EditFields::*field;
+    bool trimmed = false; // when it is read
+};
+constexpr TextField textFields[] = {
+    {R::FrameName, &EditFields::FrameName},           {R::LineFrameCode, &EditFields::LineFrameCode},
+    {R::RedMarker, &EditFields::RedMarker},           {R::AutoMarker, &EditFields::AutoMarker},
+    {R::FrameFolder, &EditFields::FrameFolder, true}, {R::TextFont, &EditFields::TextFont, true}};
+
+// No page sets these columns; the values of the record are kept.
+constexpr R::Column carriedColumns[] = {R::Spare59, R::Spare61, R::Spare90};
+
 // True when the field has a digit behind at most a sign, blanks and a point.
 bool beginsWithNumber(const QString& field) {
     static const QRegularExpression number(QStringLiteral("^[+-]? *\\.?[0-9]"));
     return number.match(field).hasMatch();
 }
 
+QString columnOf(const QString& record, R::Column column) {
+    return record.mid(column.position - 1, column.width);
+}
+
 } // namespace
 
 void UnpackEditState(const QString& record, EditFields& fields) {
-    namespace R = EditRecord;
     fields.EditState = LeftField(record, R::width);
-    const auto text = [&](R::Column column) { return fields.EditState.mid(column.position - 1, column.width); };
-    const auto number = [&](R::Column column) { return Val16(text(column)); };
-
-    // Without the edit when a damaged record has letters in place of a number: 0 would print the picture black or
-    // shrunk to nothing.
-    const auto unlessLetters = [&](R::Column column, double without) {
+    const auto text = [&](R::Column column) { return columnOf(fields.EditState, column); };
+    // A picture stays without an edit whose field of the record has letters in place of a number: 0 would print it
+    // black or shrunk to nothing.
+    const auto isDamaged = [&](R::Column column) {
         const QString field = text(column).trimmed();
-        return field.isEmpty() || beginsWithNumber(field) ? Val(field) : without;
+        return !field.isEmpty() && !beginsWithNumber(field);
     };
-    const auto placed = [&](R::Column column, std::int16_t without) {
-        return unlessLetters(column, without) == without ? without : number(column);
-    };
-    fields.GainR = static_cast<float>(unlessLetters(R::GainR, 1));
-    fields.GainG = static_cast<float>(unlessLetters(R::GainG, 1));
-    fields.GainB = static_cast<float>(unlessLetters(R::GainB, 1));
-    fields.RotationCode = placed(R::RotationCode, 180);
-    fields.ZoomPercent = placed(R::ZoomPercent, 100);
-    fields.PanX = placed(R::PanX, 999);
-    fields.PanY = placed(R::PanY, 999);
-    fields.ToneFlag = number(R::ToneFlag);
-    fields.SpareFlag = number(R::SpareFlag);
-    fields.FrameName = text(R::FrameName);
-    fields.LineFrameCode = text(R::LineFrameCode);
-    fields.RedMarker = text(R::RedMarker);
-    fields.AutoMarker = text(R::AutoMarker);
-    fields.FrameFolder = text(R::FrameFolder).trimmed();
-    fields.TextFontSize = std::max<std::int16_t>(8, number(R::TextFontSize));
-    fields.TextAlign = number(R::TextAlign);
-    fields.TextOn = number(R::TextOn);
+    for (const auto& [column, field] : gainFields)
+        fields.*field = isDamaged(column) ? 1.0F : static_cast<float>(Val(text(column).trimmed()));
+    for (const auto& [column, field, damaged] : numberFields)
+        fields.*field = damaged && isDamaged(column) ? *damaged : Val16(text(column));
+    for (const auto& [column, field, trimmed] : textFields)
+        fields.*field = trimmed ? text(column).trimmed() : text(column);
+    fields.TextFontSize = std::max<std::int16_t>(8, fields.TextFontSize);
     fields.Tag = text(R::Tag).trimmed();
-    fields.TextBlue = number(R::TextBlue);
-    fields.TextGreen = number(R::TextGreen);
-    fields.TextRed = number(R::TextRed);
-    fields.TextX = number(R::TextX);
-    fields.TextY = number(R::TextY);
-    fields.TextVertical = number(R::TextVertical);
-    fields.TextStyle = number(R::TextStyle);
-    fields.TextFont = text(R::TextFont).trimmed();
     fields.TextBody = R::stored(R::TextBody, text(R::TextBody));
 }
 
 void PackEditState(EditFields& fields, const QString& paperBorderCode, const QString& frameFolder) {
-    namespace R = EditRecord;
     const QString frame = R::frameOfBorder(paperBorderCode);
     if (frame != R::noFrame && fields.FrameName == R::noFrame) {
         fields.FrameName = frame;
@@ -110,41 +135,15 @@ void PackEditState(EditFields& fields, const QString& paperBorderCode, const QSt
     const auto text = [&](R::Column column, const QString& value) {
         record.replace(column.position - 1, column.width, LeftField(value, column.width));
     };
-    const auto number = [&](R::Column column, int value) { text(column, QString::number(value)); };
-    // No page sets these fields; the values of the record are kept.
-    const auto carried = [&](R::Column column) {
-        number(column, Val16(before.mid(column.position - 1, column.width)));
-    };
-
-    text(R::GainR, PlainNumber(fields.GainR));
-    text(R::GainG, PlainNumber(fields.GainG));
-    text(R::GainB, PlainNumber(fields.GainB));
-    number(R::RotationCode, fields.RotationCode);
-    number(R::ZoomPercent, fields.ZoomPercent);
-    number(R::PanX, fields.PanX);
-    number(R::PanY, fields.PanY);
-    number(R::ToneFlag, fields.ToneFlag);
-    number(R::SpareFlag, fields.SpareFlag);
-    text(R::FrameName, fields.FrameName);
-    text(R::LineFrameCode, fields.LineFrameCode);
-    text(R::RedMarker, fields.RedMarker);
-    text(R::AutoMarker, fields.AutoMarker);
-    text(R::FrameFolder, fields.FrameFolder);
-    number(R::TextFontSize, fields.TextFontSize);
-    number(R::TextAlign, fields.TextAlign);
-    carried(R::Spare59);
-    carried(R::Spare61);
-    number(R::TextOn, fields.TextOn);
+    for (const auto& [column, field] : gainFields)
+        text(column, PlainNumber(fields.*field));
+    for (const auto& [column, field, damaged] : numberFields)
+        text(column, QString::number(fields.*field));
+    for (const auto& [column, field, trimmed] : textFields)
+        text(column, fields.*field);
+    for (const R::Column column : carriedColumns)
+        text(column, QString::number(Val16(columnOf(before, column))));
     text(R::Tag, QStringLiteral("ddd"));
-    number(R::TextBlue, fields.TextBlue);
-    number(R::TextGreen, fields.TextGreen);
-    number(R::TextRed, fields.TextRed);
-    number(R::TextX, fields.TextX);
-    number(R::TextY, fields.TextY);
-    carried(R::Spare90);
-    number(R::TextVertical, fields.TextVertical);
-    number(R::TextStyle, fields.TextStyle);
-    text(R::TextFont, fields.TextFont);
     text(R::TextBody, fields.TextBody);
     fields.EditState = record;
 }
