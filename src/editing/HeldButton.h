@@ -4,19 +4,18 @@ namespace lumora {
 
 class Ticker;
 
-// The held button of a page. Its ticker runs until the button is let go; a press that ends before the first tick counts
-// as one tick.
+// The held button of a page. Its ticker runs until the button is let go.
 class HeldButton {
 public:
-    // Another button that was held is let go.
+    // Lets go of the button that was held before.
     void press(Ticker& ticker);
     void release();
     bool isHeld() const { return m_ticker != nullptr; }
     bool holds(const Ticker& ticker) const { return m_ticker == &ticker; }
 
-    // A tick handler asks this first: false for a tick that was under way when the button was let go.
+    // False for a tick that was under way when the button was let go; a tick handler asks it first.
     bool ticks(const Ticker& ticker);
-    void tickOnceIfNone();
+    void tickOnceIfNone(); // makes a press that ends before the first tick count as one
 
 private:
     Ticker* m_ticker = nullptr;

@@ -16,6 +16,13 @@ struct CaptionText {
     const char16_t* englishHint = hebrewHint;
 };
 
+// The same for a text that is no caption's: what is spoken of a control.
+struct WordingText {
+    QString& text;
+    const char16_t* hebrew;
+    const char16_t* english = hebrew;
+};
+
 // Every caption of the table says its text and its hint in the language of the session.
 inline void setCaptions(const SessionState& state, std::initializer_list<CaptionText> texts) {
     for (const CaptionText& text : texts) {
@@ -23,6 +30,11 @@ inline void setCaptions(const SessionState& state, std::initializer_list<Caption
         if (text.hebrewHint != nullptr)
             text.caption.hint = state.wording(text.hebrewHint, text.englishHint);
     }
+}
+
+inline void setWordings(const SessionState& state, std::initializer_list<WordingText> texts) {
+    for (const WordingText& text : texts)
+        text.text = state.wording(text.hebrew, text.english);
 }
 
 } // namespace lumora

@@ -17,7 +17,7 @@ constexpr int moveMilliseconds = 20;
 constexpr int sizeMilliseconds = 4;
 constexpr int paletteField = 46; // pixels a side: a fingertip
 
-// Full colours that print as they look. The first after white is the one a new caption has.
+// A new caption has the second.
 constexpr std::array<QRgb, 9> colours = {0xFFFFFFFF, 0xFFFFFF1E, 0xFFFF8C00, 0xFFDC1414, 0xFFFF4FA3,
                                          0xFF7B2CBF, 0xFF1450D2, 0xFF148C28, 0xFF000000};
 
@@ -62,43 +62,6 @@ void mikledet::open(const QString& text, bool onPicture) {
     Q_EMIT changed();
 }
 
-void mikledet::setTexts() {
-    const auto say = [this](const QString& hebrew, const QString& english) { return m_state.wording(hebrew, english); };
-    Title.text = say(u"מקלדת"_s, u"Keyboard"_s);
-    Command1.text = say(u"Space  רווח"_s, u"Space"_s);
-    Command4.text = u"ע"_s;
-    Command9.text = u"e"_s;
-    Command2.text = u"E"_s;
-    Command5.text = say(u"עוד"_s, u"More"_s);
-    Command7.text = u"Enter"_s;
-    Command6.text = say(u"נקה Clear"_s, u"Clear"_s);
-    Command8.text = say(u"הסר טקסט מתמונה הזו"_s, u"Remove this text"_s);
-    Command10.text = say(u"רשימת גופנים"_s, u"Font list"_s);
-    Command13.text = say(u"הודעות מוכנות"_s, u"Ready messages"_s);
-    Command14.text = say(u"מקלדת"_s, u"Keyboard"_s);
-    CommandDone.text = say(u"סיום"_s, u"Done"_s);
-    Check4.text = say(u"הצג טקסט"_s, u"Show text"_s);
-    Command3.hint = say(u"מחק את האות האחרונה"_s, u"Take back the last letter"_s);
-    Image1.hint = say(u"הגדל את האותיות"_s, u"Larger letters"_s);
-    Image2.hint = say(u"הקטן את האותיות"_s, u"Smaller letters"_s);
-    Image3.hint = say(u"רגיל, מודגש, נטוי"_s, u"Regular, bold, italic"_s);
-    Image4.hint = say(u"לרוחב או לאורך"_s, u"Across or down"_s);
-    Image15[0].hint = say(u"הזז שמאלה"_s, u"Move left"_s);
-    Image15[1].hint = say(u"הזז ימינה"_s, u"Move right"_s);
-    Image15[2].hint = say(u"הזז למעלה"_s, u"Move up"_s);
-    Image15[3].hint = say(u"הזז למטה"_s, u"Move down"_s);
-    Image5[0].hint = say(u"הטקסט מתחיל בנקודה"_s, u"The text begins at its point"_s);
-    Image5[1].hint = say(u"הטקסט ממורכז בנקודה"_s, u"The text is centred on its point"_s);
-    Image5[2].hint = say(u"הטקסט מסתיים בנקודה"_s, u"The text ends at its point"_s);
-    Picture18.hint = say(u"צבע הטקסט"_s, u"Colour of the text"_s);
-    words.text = say(u"הטקסט שעל התמונה"_s, u"The text on the picture"_s);
-    words.hebrewLetters = say(u"אותיות בעברית"_s, u"Hebrew letters"_s);
-    words.smallLetters = say(u"אותיות קטנות באנגלית"_s, u"Small letters"_s);
-    words.capitalLetters = say(u"אותיות גדולות באנגלית"_s, u"Capital letters"_s);
-    words.blankKey = say(u"רווח"_s, u"Space"_s);
-    relabel(letters);
-}
-
 void mikledet::relabel(KeyLayout::Letters to) {
     letters = to;
     for (int key = 0; key < KeyLayout::keys; ++key)
@@ -125,7 +88,7 @@ void mikledet::press(int key) {
         type(leter[static_cast<std::size_t>(key)].text);
 }
 
-void mikledet::KeyPress(QChar character) {
+void mikledet::takeKey(QChar character) {
     if (character == u' ') {
         typeBlank();
     } else if (character == u'\r' || character == u'\n') {
@@ -196,7 +159,7 @@ void mikledet::backToEditor() {
     m_chain.follow(pageId, Outcome::EditingDone);
 }
 
-void mikledet::Image15_MouseDown(int direction) {
+void mikledet::holdArrow(int direction) {
     constexpr std::int16_t step = CaptionStep::step;
     switch (direction) {
     case 0:

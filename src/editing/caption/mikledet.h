@@ -16,7 +16,7 @@ class PageChain;
 
 // The on-screen keyboard: the customer writes a picture's caption on it, below the editor's picture.
 //
-// What it changes are the caption's fields of the edit state; the editor takes them after each change, so that the
+// The page changes the caption's fields of the edit state, and the editor takes them after each change, so that the
 // picture and the list follow at once. Positions of the caption are in pixels of the preview.
 class mikledet : public Page, private mikledetControls {
     Q_OBJECT
@@ -31,7 +31,7 @@ public:
 
     // --- events ---
 
-    // Begins with this caption; the editor brings the page to the front.
+    // Begins with this caption. The editor brings the page to the front.
     void open(const QString& text, bool onPicture);
 
     void leter_Click(int key) { press(key); }
@@ -47,18 +47,18 @@ public:
     void Check4_Click(bool on) { putOnPicture(on); }
     void Combo1_Click(int index) { chooseFont(index); }
     void CommandDone_Click() { backToEditor(); }
-    // A real keyboard does what the keys do. What can't be printed is refused.
-    void KeyPress(QChar character);
+    // A key of a real keyboard. A character that can't be printed is refused with a message.
+    void KeyPress(QChar character) { takeKey(character); }
 
     void Image1_MouseDown() { holdSize(CaptionStep::step); }
     void Image2_MouseDown() { holdSize(-CaptionStep::step); }
-    void Image15_MouseDown(int direction); // left, right, up, down
+    void Image15_MouseDown(int direction) { holdArrow(direction); } // left, right, up, down
     void Image1_MouseUp() { stopHolding(); }
     void Image2_MouseUp() { stopHolding(); }
     void Image15_MouseUp() { stopHolding(); }
     void Timer1_Tick() { moveOnce(); }
     void Timer2_Tick() { resizeOnce(); }
-    // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
+    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
     void tickOnceIfNone() { m_held.tickOnceIfNone(); }
     // The pointer was lost or the page went.
     void stopHolding() { m_held.release(); }
@@ -82,6 +82,7 @@ public:
 
 private:
     void press(int key);
+    void takeKey(QChar character);
     void type(const QString& text);
     void typeBlank();
     void takeBack();
@@ -97,6 +98,7 @@ private:
     void change(void (*step)(EditFields& edit));
     void commitText();
     void refresh();
+    void holdArrow(int direction);
     void holdSize(std::int16_t step);
     void holdMove(std::int16_t x, std::int16_t y);
     void moveOnce();

@@ -9,16 +9,16 @@ namespace ColourStep {
 
 enum class Tone { Grey, Sepia, Blue, Green };
 
-// All three gains by so many hundredths.
+// Raises all three gains by so many hundredths.
 void brighten(EditFields& edit, int hundredths);
-// More of one colour and as much less of its opposite.
+// Raise the gain of one colour by six hundredths and lower that of the other.
 void addRed(EditFields& edit);
 void addBlue(EditFields& edit);
-// All gains become that of green, which added colours leave alone.
+// Sets all gains to that of green, which added colours do not change.
 void removeAddedColours(EditFields& edit);
 void takeTone(EditFields& edit, Tone tone);
 void backToColour(EditFields& edit);
-// Gains, tone, zoom and turn as in a new record.
+// Sets gains, tone, zoom and turn as in a new record.
 void undo(EditFields& edit);
 
 } // namespace ColourStep

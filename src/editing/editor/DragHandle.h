@@ -7,7 +7,7 @@
 namespace lumora {
 
 // A handle that the pointer drags. Each move takes it a thirteenth of the pointer's distance from where it was pressed,
-// so that a far drag goes faster. Fractions are kept.
+// so that a far drag goes faster. The position keeps fractions of a pixel.
 class DragHandle {
 public:
     static constexpr double slowness = 13;

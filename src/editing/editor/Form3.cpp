@@ -1,11 +1,12 @@
 #include "editing/editor/Form3.h"
 
+#include "common/DrivePathText.h"
 #include "imaging/drawing/Drawing.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
+#include "session/CaptionTexts.h"
 #include "session/PageChain.h"
-#include "session/SessionState.h"
 
 #include <algorithm>
 
@@ -30,16 +31,16 @@ void Form3::load() {
 }
 
 void Form3::setTexts() {
-    Command1.text = m_state.wording(QStringLiteral("סובב"), QStringLiteral("Turn"));
-    Command2.text = m_state.wording(QStringLiteral("הצג שוב"), QStringLiteral("Show again"));
-    Command3.text = m_state.wording(QStringLiteral("יציאה"), QStringLiteral("Exit"));
-    unreadable =
-        m_state.wording(QStringLiteral("אי אפשר להציג את התמונה"), QStringLiteral("The picture can't be shown"));
+    setCaptions(m_state, {{Command1, u"סובב", u"Turn"},
+                          {Command2, u"הצג שוב", u"Show again"},
+                          {Command3, u"יציאה", u"Exit"},
+                          {unreadable, u"אי אפשר להציג את התמונה", u"The picture can't be shown"}});
     Q_EMIT changed();
 }
 
 void Form3::open(const QString& path) {
     Label1.text = path;
+    fileName.text = LeafName(path);
     angle = 0;
     draw();
 }
@@ -52,19 +53,6 @@ void Form3::turn() {
 void Form3::draw() {
     Picture2 = {};
     Picture2Box = {};
-    const auto read = [this]() -> Result<Bitmap> {
-        const std::optional<HostPath> file = m_platform.files.drives().toHost(Label1.text);
-        if (!file)
-            return Failure{Failure::Kind::NotFound, Label1.text};
-        const auto size = readPictureSize(*file);
-        if (!size)
-            return size.failure();
-        const double aspect = static_cast<double>(size->height) / size->width;
-        Picture2Box = {boxWidth, std::clamp(static_cast<int>(boxWidth * aspect), 1, mostBoxHeight)};
-        // More pixels than the file has would add nothing.
-        const int times = Picture2Box.height > size->height ? 1 : fineness;
-        return loadPictureScaled(*file, {Picture2Box.width * times, Picture2Box.height * times});
-    };
     const Result<Bitmap> picture = read();
     if (picture) {
         Picture2 = turned(*picture, static_cast<QuarterTurn>(angle));
@@ -74,7 +62,22 @@ void Form3::draw() {
         Picture2Box = {};
         m_platform.dialogs.message(picture.failure().message);
     }
+    unreadable.visible = Picture2.isNull();
     Q_EMIT changed();
+}
+
+Result<Bitmap> Form3::read() {
+    const std::optional<HostPath> file = m_platform.files.drives().toHost(Label1.text);
+    if (!file)
+        return Failure{Failure::Kind::NotFound, Label1.text};
+    const auto size = readPictureSize(*file);
+    if (!size)
+        return size.failure();
+    const double aspect = static_cast<double>(size->height) / size->width;
+    Picture2Box = {boxWidth, std::clamp(static_cast<int>(boxWidth * aspect), 1, mostBoxHeight)};
+    // More pixels than the file has would add nothing.
+    const int times = Picture2Box.height > size->height ? 1 : fineness;
+    return loadPictureScaled(*file, {Picture2Box.width * times, Picture2Box.height * times});
 }
 
 void Form3::close() {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "imaging/files/PictureFile.h"
 #include "session/Caption.h"
@@ -12,15 +13,16 @@ struct SessionState;
 class PageChain;
 
 struct Form3Controls : Controls {
-    Caption Label1{*this, u"Label1"}; // drive path of the picture
+    Caption Label1{*this, u"Label1"};     // drive path of the picture
+    Caption fileName{*this, u"fileName"}; // its leaf name
     Caption Command1{*this, u"Command1"}, Command2{*this, u"Command2"}, Command3{*this, u"Command3"};
     int angle = 0;           // 0, 90, 180 or 270 degrees clockwise
     PictureSize Picture2Box; // the box of the picture in logical pixels; the view puts it in the middle
     Bitmap Picture2;         // the turned picture, finer than its box; null when it can't be read
-    QString unreadable;      // stands in place of a picture that can't be read
+    Caption unreadable{*this, u"unreadable", Caption::At::Hidden}; // stands in place of a picture that can't be read
 };
 
-// A picture turned, to look at: the customer sees one picture of the page of pictures large. Nothing of it is kept.
+// A picture turned: the customer looks at one picture of the page of pictures, large. Nothing of it is kept.
 class Form3 : public Page, private Form3Controls {
     Q_OBJECT
 public:
@@ -31,18 +33,21 @@ public:
     void load() override;
     void setTexts() override;
 
-    // Events
+    // --- events ---
+
     void open(const QString& path); // a drive path, upright; who opens it brings the page to the front
     void Command1_Click() { turn(); }
     void Command2_Click() { draw(); }
     void Command3_Click() { close(); }
 
-    // State
+    // --- state ---
+
     const Form3Controls& controls() const override { return *this; }
 
 private:
     void turn(); // a quarter clockwise
     void draw(); // reads the file again
+    Result<Bitmap> read();
     void close();
 
     const SessionState& m_state;

@@ -12,8 +12,8 @@ class LineFrameChoice {
 public:
     static QStringList styles();
 
-    // The style so many places further, held at either end. False, and nothing changes, for a step back before the
-    // first choice.
+    // Goes so many styles further, at most to either end. Returns false and changes nothing for a step back before
+    // the first choice.
     bool step(int places);
     void takeColour(QChar letter) { m_letter = letter; }
 

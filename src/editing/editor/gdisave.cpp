@@ -6,6 +6,7 @@
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
+#include "session/CaptionTexts.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
@@ -83,13 +84,14 @@ void gdisave::load() {
 }
 
 void gdisave::setTexts() {
-    cmdSaveAsJpg.text = m_state.wording(QStringLiteral("שמור את התמונה"), QStringLiteral("Save the picture"));
-    Command1.text = m_state.wording(QStringLiteral("בטל"), QStringLiteral("Cancel"));
-    Command2.text = m_state.wording(QStringLiteral("שלח"), QStringLiteral("Send"));
-    Command5.text = QStringLiteral("Command5");
-    Command6.text = QStringLiteral("save info");
-    Command7.text = QStringLiteral("Command7_litlpic");
-    Label1.text = m_state.wording(QStringLiteral("איכות: "), QStringLiteral("Quality: ")) + QString::number(HScroll1);
+    setCaptions(m_state, {{cmdSaveAsJpg, u"שמור את התמונה", u"Save the picture"},
+                          {Command1, u"בטל", u"Cancel"},
+                          {Command2, u"שלח", u"Send"},
+                          {Command5, u"Command5"},
+                          {Command6, u"save info"},
+                          {Command7, u"Command7_litlpic"},
+                          {Label1, u"איכות: ", u"Quality: "}});
+    Label1.text += QString::number(HScroll1);
     Q_EMIT changed();
 }
 

@@ -26,8 +26,8 @@ struct gdisaveControls : Controls {
         Command6{*this, u"Command6"}, Command7{*this, u"Command7"}, cmdSaveAsJpg{*this, u"cmdSaveAsJpg"};
 };
 
-// The saver: the preparation and sending pages save their pictures as JPEG by it; nobody sees the page, which stays
-// loaded until the program ends. Nothing is saved unless GdiReady is set.
+// The saver: the preparation and sending pages save their pictures as JPEG files by it. The page is never shown and
+// stays loaded until the program ends. It saves nothing unless GdiReady is set.
 class gdisave : public Page, private gdisaveControls {
     Q_OBJECT
 public:
@@ -41,11 +41,18 @@ public:
     void load() override;
     void setTexts() override;
 
-    // Events
+    // --- events ---
+
     void saveOrderSheet(const Bitmap& picture); // quality 90, under the names of the order's sheet
     void saveProof(const Bitmap& picture);      // quality 70, as 000.jpg
     void Command6_Click() { saveOrderSheet(PicPic); }
     void Command7_Click() { saveProof(LitlPic); }
+
+    // Saves under a drive path; the quality is held within 0 to 100. A failure is shown and gives false.
+    bool SaveJpeg(const Bitmap& picture, const QString& path, int quality);
+    // Shows a status that is not 0 in a box, with the path and reason behind it where they are known. Returns the
+    // status.
+    int ShowGdiStatus(int status, const QString& detail = {});
 
     // gdisaveUnused.cpp
     void saveScratch(const Bitmap& picture); // quality 80, as the picture of the current step
@@ -60,13 +67,8 @@ public:
     void Command9_Click();
     Bitmap PictureFromFile(const QString& path); // null when the file can't be read; the failure is shown
 
-    // Saves under a drive path; the quality is held within 0 to 100. A failure is shown and gives false.
-    bool SaveJpeg(const Bitmap& picture, const QString& path, int quality);
-    // Shows a status that is not 0 in a box, with the path and reason behind it where they are known. Returns the
-    // status.
-    int ShowGdiStatus(int status, const QString& detail = {});
+    // --- state ---
 
-    // State
     const gdisaveControls& controls() const override { return *this; }
     static QString GdiStatusText(int status);
     enum class Encoder { Jpeg };

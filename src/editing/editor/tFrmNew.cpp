@@ -359,12 +359,12 @@ void tFrmNew::widenMarkers(int pixels) {
     Q_EMIT changed();
 }
 
-void tFrmNew::CropHandle_MouseDown(CropFrame::Corner corner, QPointF at) {
+void tFrmNew::takeCorner(CropFrame::Corner corner, QPointF at) {
     m_cropCorner = corner;
     m_cropHandle.press(at);
 }
 
-void tFrmNew::CropHandle_MouseMove(QPointF at) {
+void tFrmNew::dragCorner(QPointF at) {
     if (!m_cropHandle.held())
         return;
     crop.drag(m_cropCorner, m_cropHandle.distance(at));

@@ -47,7 +47,7 @@ public:
     void openPicture(); // of the session's edit fields
     void takeCaption(); // the caption's fields were changed: packs, draws, stores, places Labeltext
     void keepRecord();  // packs and stores
-    // The pointer was lost or the page went: what is in hand is let go as by its MouseUp.
+    // Ends a held button and a drag as their MouseUp does: the pointer was lost, or the page went.
     void stopHolds();
 
     void Command17_Click() { openPicture(); }
@@ -74,9 +74,9 @@ public:
 
     // Image2: 0 and 1 closer and further, 3 and 4 darker and lighter (held); 5 undo, 6 red, 7 red-eye, 8 no added
     // colours, 10 blue (clicked). 2 and 9 do nothing.
-    void Image2_MouseDown(int index);
+    void Image2_MouseDown(int index) { holdTool(index); }
     void Image2_MouseUp(int) { endHold(); }
-    void Image2_Click(int index);
+    void Image2_Click(int index) { useTool(index); }
     void Image2_MouseMove() { hidePanels(); }
 
     void Image135_MouseDown() { beginHold(Held::Right); }
@@ -98,7 +98,7 @@ public:
     void Timer6_Tick() { turn(); }
     void Timer7_Tick() { moveAcross(); }
     void Timer8_Tick() { moveDown(); }
-    // A press that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
+    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
     void tickOnceIfNone() { m_held.tickOnceIfNone(); }
 
     void Image15_Click() { turnQuarterRight(); }
@@ -107,7 +107,7 @@ public:
     void VScrollZ_Change(int value) { setBarZoom(value); }
 
     void PicPic_MouseDown(QPointF at) { beginDrag(at); }
-    void PicPic_MouseMove(QPointF at) { drag(at); } // also without a drag: hides the panels
+    void PicPic_MouseMove(QPointF at) { drag(at); } // hides the panels also where nothing is dragged
     void PicPic_MouseUp() { endDrag(); }
     void Labeltext_MouseDown(QPointF at) { beginCaptionDrag(at); }
     void Labeltext_MouseMove(QPointF at) { dragCaption(at); }
@@ -138,8 +138,8 @@ public:
     void Command13_Click() { markInset(); }
     void Command16_Click() { widenMarkers(CropFrame::step); }
     void Command15_Click() { widenMarkers(-CropFrame::step); }
-    void CropHandle_MouseDown(CropFrame::Corner corner, QPointF at);
-    void CropHandle_MouseMove(QPointF at);
+    void CropHandle_MouseDown(CropFrame::Corner corner, QPointF at) { takeCorner(corner, at); }
+    void CropHandle_MouseMove(QPointF at) { dragCorner(at); }
     void CropHandle_MouseUp() { m_cropHandle.release(); }
 
     // The small view that the page of pictures stores, in logical pixels. Null if nothing was drawn since it was taken.
@@ -181,8 +181,11 @@ private:
     void markCorners();
     void markInset();
     void widenMarkers(int pixels);
+    void takeCorner(CropFrame::Corner corner, QPointF at);
+    void dragCorner(QPointF at);
 
     // Held buttons, turning, dragging.
+    void holdTool(int index);
     void beginHold(Held what);
     void dropHold();
     void endHold(Release release = Release::MouseUp);
@@ -202,6 +205,7 @@ private:
     void endDrag();
 
     // Colours.
+    void useTool(int index);
     void changeColours(void (*step)(EditFields& edit));
     void takeTone(Tone tone);
     void backToColour();

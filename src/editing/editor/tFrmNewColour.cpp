@@ -16,7 +16,7 @@ void tFrmNew::brighten() {
     PackEditState();
 }
 
-void tFrmNew::Image2_Click(int index) {
+void tFrmNew::useTool(int index) {
     switch (index) {
     case 5:
         return undoAllEdits();

@@ -62,9 +62,14 @@ struct tFrmNewControls : Controls {
 
     bool hintsAsLabels = false; // Image29: a pointer that can't hover reads the hints below the buttons
 
-    // Words beside the controls: titles of the groups of tools, and what is spoken. %1 is a picture's leaf name.
+    // The titles of the groups of tools.
+    Caption placeTitle{*this, u"placeTitle"}, turnTitle{*this, u"turnTitle"}, lightTitle{*this, u"lightTitle"},
+        framesTitle{*this, u"framesTitle"};
+    Caption Frame4Opener{*this, u"Frame4Opener"}; // opens the panel of the turns for a finger, which can't hover
+    Caption hintsClose{*this, u"hintsClose"};
+
+    // What is spoken. %1 is a picture's leaf name.
     struct {
-        QString place, turn, light, frames, fineTurn, closeHints;
         QString categories, framesOfCategory, operatorPanel, lineStyles;
         QString emptyCell, openCell, otherCell;
     } words;

@@ -53,7 +53,7 @@ void tFrmNew::stopHolds() {
     m_cropHandle.release();
 }
 
-void tFrmNew::Image2_MouseDown(int index) {
+void tFrmNew::holdTool(int index) {
     const std::map<int, Held> held = {{0, Held::Closer}, {1, Held::Further}, {3, Held::Darker}, {4, Held::Lighter}};
     const auto found = held.find(index);
     if (found == held.end())

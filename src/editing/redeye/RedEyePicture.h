@@ -29,8 +29,8 @@ public:
     // Ends the undo copy; its file stays if it holds a step back.
     void end() { m_undo.end(); }
 
-    // Keeps the picture as it is now for one step back, and what the customer's file holds in the part that changes.
-    // Waits for the disk while isReady() is false.
+    // Keeps the picture as it is now for one step back, and for cancelAll() what the customer's file holds in the part
+    // that changes. Waits for the disk while isReady() is false.
     bool isReady() const { return m_undo.isReady(); }
     Result<void> keep(const QRect& part);
 

@@ -125,7 +125,7 @@ void RedI::press(Button button, QPointF at) {
         return;
     if (button == Button::Right) {
         m_drag.release();
-        kofez_Open();
+        openMenu();
         return;
     }
     m_drag.press(at);
@@ -174,7 +174,7 @@ void RedI::beginHold(Ticker& timer) {
         m_held.press(timer);
 }
 
-void RedI::Arrow_MouseUp() {
+void RedI::endArrow() {
     stopHolds();
     if (!canCorrect())
         return;

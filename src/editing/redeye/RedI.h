@@ -48,7 +48,7 @@ public:
     void Image13_MouseDown() { beginHold(Timer3); }
     void Image14_MouseDown() { beginHold(Timer4); }
     void Image15_MouseDown() { beginHold(Timer5); }
-    void Arrow_MouseUp();
+    void Arrow_MouseUp() { endArrow(); }
     static constexpr int arrowStep = 2; // pixels of the picture, each 100 ms
     void Timer2_Tick() { moveCircle(Timer2, 0, -arrowStep); }
     void Timer3_Tick() { moveCircle(Timer3, 0, arrowStep); }
@@ -63,7 +63,7 @@ public:
     void Size_MouseUp() { stopHolds(); }
     void Timer1_Tick() { resizeOnce(); }
     void Combo1_Change(int index) { turnWheel(index); }
-    // A press of a held button that ends before the first tick counts as one: a view calls this ahead of the MouseUp.
+    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
     void tickOnceIfNone() { m_held.tickOnceIfNone(); }
     void stopHolds() { m_held.release(); }
 
@@ -78,23 +78,23 @@ public:
     void Frame6_Click() { darken(); }
     void Image6_MouseMove() { tellWhenToDarken(); }
     void Timer7_Tick() { hideNotice(); }
-    void CleanList(); // List2 becomes List1 without repeats
+    void CleanList(); // sets List2 to List1 without repeats
     void Image7_Click() { goBack(); }
     void Image5_Click() { cancelAll(); }
 
     // The menu
-    void kofez_Open();
-    void kofez_Close() { show(kofez, false); }
+    void kofez_Open() { openMenu(); }
+    void kofez_Close() { closeMenu(); }
     void Bsisi_Click() { fixFromMenu(0); }
     void amok2_Click() { fixFromMenu(15); }
     void amok3_Click() { fixFromMenu(30); }
     void amok4_Click() { fixFromMenu(45); }
     void amok5_Click() { fixFromMenu(65); }
     void amok_Click() { deepen(); }
-    void Memokad_Click() { kofez_Close(); }
+    void Memokad_Click() { closeMenu(); }
     void Rstor_Click() { cancelAll(); }
 
-    void CommandHelp_Click();
+    void CommandHelp_Click() { openHelp(); }
     void CommandHelpClose_Click() { show(FrameHelp, false); }
     void Image8_Click() { accept(); }
     void Image9_Click() { leave(); }
@@ -129,6 +129,7 @@ private:
     void place(QPoint centre);
     void magnify(int to);
     void beginHold(Ticker& timer);
+    void endArrow();
     void moveCircle(const Ticker& timer, int right, int down);
     void holdSize(int step);
     void resizeOnce();
@@ -155,6 +156,9 @@ private:
     void forgetLists();
     void markCorrected();
 
+    void openMenu();
+    void closeMenu() { show(kofez, false); }
+    void openHelp();
     void accept();
     void leave();
     void close();

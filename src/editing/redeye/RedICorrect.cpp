@@ -44,7 +44,7 @@ void RedI::deepenAndClean() {
 }
 
 void RedI::fixFromMenu(int level) {
-    kofez_Close();
+    closeMenu();
     RedFix(level);
 }
 
@@ -200,14 +200,14 @@ void RedI::markCorrected() {
 
 // The menu and the instructions
 
-void RedI::kofez_Open() {
+void RedI::openMenu() {
     if (!ready())
         return;
     stopHolds();
     show(kofez, true);
 }
 
-void RedI::CommandHelp_Click() {
+void RedI::openHelp() {
     stopHolds();
     show(FrameHelp, true);
 }

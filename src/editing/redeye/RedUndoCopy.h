@@ -18,7 +18,7 @@ namespace lumora {
 // The one step back of a correction: a file with the whole picture as it was before the latest change. The file is
 // written once, in the background, while the customer looks for the eye, since writing 50 megapixels takes seconds;
 // before a later change only the rows that differ are brought up to date. The file gets its name with the first change,
-// so that a visit without a correction leaves no undo copy. Only what this visit wrote is read back.
+// so that a visit without a correction leaves no undo copy. A step back never reads the file of an earlier visit.
 class RedUndoCopy {
 public:
     RedUndoCopy() = default;

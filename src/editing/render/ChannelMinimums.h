@@ -17,8 +17,8 @@ struct ChannelMinimums {
     std::array<float, 3> A_G_MIN{};
     std::array<float, 3> A_B_MIN{};
 
-    // Sets each key that the file of a drive path has, in whatever order; keys that it lacks keep their value, and a
-    // key that is unknown is passed over. A file that is missing is no failure and changes nothing.
+    // Sets the values of the keys in the file of a drive path, in any order. A value whose key the file lacks stays,
+    // an unknown key is passed over, and a missing file is no failure.
     Result<void> readFrom(const Files& files, const QString& path);
     Result<void> writeTo(const Files& files, const QString& path) const;
 

@@ -24,7 +24,7 @@ ColourMatrix coloursOf(const EditFields& edit) {
     return ColourMatrix::fromGains(edit.GainR, edit.GainG, edit.GainB, crossGain);
 }
 
-// The caption as the record stores it: a preview never shows more than the print.
+// The caption as the record stores it, so that a preview never shows more than the print.
 PictureCaption captionOf(const EditFields& edit) {
     namespace R = EditRecord;
     const auto channel = [](std::int16_t value) { return std::clamp<int>(value, 0, 255); };
@@ -44,7 +44,7 @@ PictureCaption captionOf(const EditFields& edit) {
     return caption;
 }
 
-// What lies over the picture, in preview and print alike. What is empty is left out.
+// Draws what lies over the picture, in preview and print alike. An empty frame or caption is left out.
 void drawOver(Bitmap& paper, const KeyedFrame& frame, const CaptionInk& ink) {
     drawKeyedFrame(paper, frame);
     drawInk(paper, ink);

@@ -18,8 +18,7 @@ namespace lumora {
 
 struct EditFields;
 
-// A tone makes the picture grey first: this much of red, green and blue together, so that white comes out at nine
-// tenths.
+// The share of each channel in the grey that a tone begins with; the three add up to nine tenths.
 inline constexpr float greyWeight = 0.3F;
 
 enum class FrameUse { Preview, Print };

@@ -27,7 +27,7 @@ Result<QString> ScrambleFrameFile(const SessionState& state, const Files& files,
     const Result<QByteArray> bytes = files.read(path);
     if (!bytes)
         return bytes.failure();
-    // The pieces never leave memory, so that nothing is left half joined.
+    // The pieces stay in memory, so that a failure leaves nothing half joined.
     const QString result = results + QStringLiteral("\\!k.bmp");
     if (const Result<void> written =
             files.writeWhole(result, bytes->mid(block, block) + bytes->left(block) + bytes->mid(2 * block));

@@ -7,7 +7,7 @@
 namespace lumora {
 
 // The palette of line frames: twelve colours in three columns of four cells, numbered down the columns, and the marker
-// that jumps to the cell under the pointer.
+// on the cell that the pointer was over last.
 class LineFramePalette {
 public:
     static constexpr int cell = 33;
@@ -15,7 +15,7 @@ public:
     static constexpr int rows = 4;
     static constexpr int bottom = 124; // below it the pointer moves nothing
 
-    // A point of the palette. Outside its cells the marker stays.
+    // Puts the marker on the cell at a point of the palette; outside the cells it stays.
     void moveTo(QPointF at);
 
     int index() const { return m_index; }

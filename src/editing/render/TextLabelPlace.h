@@ -24,7 +24,8 @@ QString blanks(const EditFields& edit);
 
 TextLabelBox boxOf(const EditFields& edit);
 
-// A near inverse: captions that end at their anchor come back 3 pixels to the right. To whole pixels, ties to even.
+// The anchor in whole pixels, ties to even. A caption that ends at its anchor comes back 3 pixels further right, as
+// does one that runs down from it.
 QPoint anchorOf(const TextLabelBox& box, const EditFields& edit);
 
 } // namespace TextLabelPlace

@@ -7,7 +7,7 @@ namespace lumora {
 
 class PictureBox;
 
-class Form3View : public PageView {
+class Form3View : public ViewOf<Form3> {
     Q_OBJECT
 public:
     Form3View(Form3& page, const SessionState& state, const Theme& theme);
@@ -18,11 +18,8 @@ protected:
     void render() override;
 
 private:
-    Form3& m_page;
-    const Form3Controls& m_shows;
     PictureBox* m_picture;
-    QLabel* m_unreadable;
-    QPushButton* m_turn;
+    QPushButton* m_turn = nullptr;
 };
 
 } // namespace lumora

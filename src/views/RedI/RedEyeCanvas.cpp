@@ -16,6 +16,15 @@ constexpr int longPress = 600;
 constexpr int wheelStep = 120;
 constexpr double finger = 10;
 
+// Yellow on a dark rim, so that it is seen on any picture.
+void drawCircle(QPainter& painter, const QRectF& circle, int rim, int line) {
+    painter.setBrush(Qt::NoBrush);
+    painter.setPen(QPen(Theme::Colour::Ink, rim));
+    painter.drawEllipse(circle);
+    painter.setPen(QPen(Theme::Colour::Marker, line));
+    painter.drawEllipse(circle);
+}
+
 } // namespace
 
 RedEyeCanvas::RedEyeCanvas(RedI& page, const Theme& theme, QWidget* parent)
@@ -58,14 +67,8 @@ void RedEyeCanvas::paintEvent(QPaintEvent*) {
     painter.drawImage(placed(part), m_page.picture().Picture1.image(), part);
     if (m_page.controls().Image1.visible && !m_page.picture().Image1Picture.isNull())
         painter.drawImage(placed(m_page.picture().patchPlace), m_page.picture().Image1Picture.image());
-    if (!m_page.controls().RedTargetRectangle.visible)
-        return;
-    const QRectF circle = placed(m_page.sight().circle());
-    painter.setBrush(Qt::NoBrush);
-    painter.setPen(QPen(Theme::Colour::Ink, m_theme.px(5)));
-    painter.drawEllipse(circle);
-    painter.setPen(QPen(Theme::Colour::Marker, m_theme.px(3)));
-    painter.drawEllipse(circle);
+    if (m_page.controls().RedTargetRectangle.visible)
+        drawCircle(painter, placed(m_page.sight().circle()), m_theme.px(5), m_theme.thick());
 }
 
 void RedEyeCanvas::mousePressEvent(QMouseEvent* event) {
@@ -102,38 +105,28 @@ void RedEyeCanvas::wheelEvent(QWheelEvent* event) {
 void RedEyeCanvas::keyPressEvent(QKeyEvent* event) {
     switch (event->key()) {
     case Qt::Key_Up:
-        m_page.Image12_MouseDown();
-        endTap();
-        break;
+        return tap(&RedI::Image12_MouseDown);
     case Qt::Key_Down:
-        m_page.Image13_MouseDown();
-        endTap();
-        break;
+        return tap(&RedI::Image13_MouseDown);
     case Qt::Key_Left:
-        m_page.Image14_MouseDown();
-        endTap();
-        break;
+        return tap(&RedI::Image14_MouseDown);
     case Qt::Key_Right:
-        m_page.Image15_MouseDown();
-        endTap();
-        break;
+        return tap(&RedI::Image15_MouseDown);
     case Qt::Key_Plus:
     case Qt::Key_Equal:
-        m_page.Combo1_Change(0);
-        break;
+        return m_page.Combo1_Change(0);
     case Qt::Key_Minus:
-        m_page.Combo1_Change(2);
-        break;
+        return m_page.Combo1_Change(2);
     case Qt::Key_Menu:
-        m_page.kofez_Open();
-        break;
+        return m_page.kofez_Open();
     default:
         QWidget::keyPressEvent(event);
     }
 }
 
-// A key moves the circle as a tap of the button does.
-void RedEyeCanvas::endTap() {
+// A key moves the circle as a tap of the arrow's button does.
+void RedEyeCanvas::tap(void (RedI::*arrowDown)()) {
+    (m_page.*arrowDown)();
     m_page.tickOnceIfNone();
     m_page.Arrow_MouseUp();
 }
@@ -179,9 +172,9 @@ void RedEyeOverview::paintEvent(QPaintEvent*) {
     };
     painter.setBrush(Qt::NoBrush);
     const QRectF seen = placed(m_canvas.visiblePart()).adjusted(1, 1, -1, -1);
-    painter.setPen(QPen(Qt::white, m_theme.px(3)));
+    painter.setPen(QPen(Qt::white, m_theme.thick()));
     painter.drawRect(seen);
-    painter.setPen(QPen(Theme::Colour::Primary, m_theme.px(2)));
+    painter.setPen(QPen(Theme::Colour::Primary, m_theme.hair()));
     painter.drawRect(seen);
     if (!m_page.controls().RedTargetRectangle.visible)
         return;
@@ -192,10 +185,7 @@ void RedEyeOverview::paintEvent(QPaintEvent*) {
         circle.setSize({least, least});
         circle.moveCenter(middle);
     }
-    painter.setPen(QPen(Theme::Colour::Ink, m_theme.px(4)));
-    painter.drawEllipse(circle);
-    painter.setPen(QPen(Theme::Colour::Marker, m_theme.px(2)));
-    painter.drawEllipse(circle);
+    drawCircle(painter, circle, m_theme.px(4), m_theme.hair());
 }
 
 void RedEyeOverview::mousePressEvent(QMouseEvent* event) {

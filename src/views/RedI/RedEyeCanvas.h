@@ -39,7 +39,7 @@ protected:
 private:
     double scale() const { return m_theme.factor() * m_page.sight().Magnification; }
     QPointF inPicture(QPointF widget) const;
-    void endTap();
+    void tap(void (RedI::*arrowDown)());
 
     RedI& m_page;
     const Theme& m_theme;

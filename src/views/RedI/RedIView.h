@@ -1,22 +1,20 @@
 #pragma once
 
 #include "editing/redeye/RedI.h"
-#include "views/window/PageView.h"
+#include "views/window/HoldingView.h"
 
 #include <utility>
 #include <vector>
 
-class QFrame;
 class QSlider;
 
 namespace lumora {
 
-class HoldButton;
 class RedEyeCanvas;
 class RedEyeOverview;
 class RedEyeSteps;
 
-class RedIView : public PageView {
+class RedIView : public HoldingView<RedI> {
     Q_OBJECT
 public:
     RedIView(RedI& page, const SessionState& state, const Theme& theme);
@@ -29,34 +27,30 @@ protected:
 
 private:
     QWidget* makeSide();
-    QLayout* makePad();
+    QWidget* makePad();
     QLayout* makeTools();
     QWidget* makeOperator();
-    // A button that shows its sign alone; the words are its hint and its spoken meaning.
-    void bindSign(const QString& name, QPushButton* button, const QString& icon, const Caption& caption);
-    // A label of instructions; the blanks at the ends of its lines are not shown.
-    QLabel* words(const QString& name, const Caption& caption);
-    HoldButton* hold(const QString& name, const Caption& caption, const char* role, const QString& icon,
-                     std::function<void()> down, std::function<void()> up);
+    void makeBars();
+    void makeOverPicture();
     void makeMenu();
     void makeHelp();
+    // A button that shows its sign alone; the words are its hint and its spoken meaning.
+    QPushButton* bindSign(QPushButton* button, const char* icon, const Caption& caption);
+    // A label of instructions; the blanks at the ends of its lines are not shown.
+    QLabel* instruction(const Caption& caption);
     void placeOverPicture();
-    void bindTheRest();
+    void renderInstructions();
 
-    RedI& m_page;
-    const RedIControls& m_shows;
     RedEyeSteps* m_steps;
     RedEyeCanvas* m_canvas;
     RedEyeOverview* m_overview = nullptr;
-    QPushButton* m_correct = nullptr;
-    QPushButton* m_accept = nullptr;
     QPushButton* m_darken = nullptr;
     QPushButton* m_darkenBeside = nullptr;
     QPushButton* m_closer = nullptr;
     QPushButton* m_further = nullptr;
     QPushButton* m_more = nullptr;
     std::vector<std::pair<QPushButton*, const Caption*>> m_signs;
-    std::vector<std::pair<QLabel*, const Caption*>> m_words;
+    std::vector<std::pair<QLabel*, const Caption*>> m_instructions;
     QLabel* m_guide = nullptr;
     QFrame* m_busy = nullptr;
     QFrame* m_notice = nullptr;

@@ -1,9 +1,8 @@
 #pragma once
 
 #include "editing/caption/mikledet.h"
-#include "views/window/PageView.h"
+#include "views/window/HoldingView.h"
 
-class QGridLayout;
 class QStackedLayout;
 
 namespace lumora {
@@ -12,7 +11,7 @@ class CaptionField;
 class PaletteBar;
 
 // A panel below the picture: what was typed, how it looks, the keys.
-class mikledetView : public PageView {
+class mikledetView : public HoldingView<mikledet> {
     Q_OBJECT
 public:
     mikledetView(mikledet& page, const SessionState& state, const Theme& theme);
@@ -31,20 +30,19 @@ private:
     QWidget* makeKeys();
     QPushButton* key(int number);
     QPushButton* toKey(QPushButton* button);
-    template <class Down, class Up>
-    QPushButton* holdButton(const QString& name, const Caption& caption, const QString& icon, Down down, Up up);
-    void sayAll();
+    QPushButton* toRound(QPushButton* button, const Caption& caption);
+    QPushButton* holdButton(const Caption& caption, const char* icon, std::function<void()> down,
+                            std::function<void()> up);
+    QPushButton* choice(const CheckCaption& caption, const QString& spoken, std::function<void()> clicked);
     void showIcon(QPushButton* button, const QString& icon);
 
-    mikledet& m_page;
-    const mikledetControls& m_shows;
     CaptionField* m_text = nullptr;
     PaletteBar* m_palette = nullptr;
     QStackedLayout* m_row = nullptr; // the appearance or the symbols
     QPushButton* m_style = nullptr;
     QPushButton* m_direction = nullptr;
-    QPushButton* m_more = nullptr;
     std::array<QPushButton*, KeyLayout::keys> m_keys{};
+    std::vector<std::pair<QWidget*, const QString*>> m_spoken; // what shows no words of its own
 };
 
 } // namespace lumora

@@ -46,6 +46,7 @@ protected:
 EditorPaper::EditorPaper(tFrmNew& page, QWidget* parent)
     : QWidget(parent)
     , m_page(page)
+    , m_shown(page.controls())
     , m_caption(new CaptionBox(this)) {
     setMouseTracking(true);
     setCursor(Qt::OpenHandCursor);
@@ -54,8 +55,8 @@ EditorPaper::EditorPaper(tFrmNew& page, QWidget* parent)
 }
 
 void EditorPaper::render() {
-    m_scale = m_page.controls().PicPicSize.width > 0 ? double(width()) / m_page.controls().PicPicSize.width : 1;
-    const TextLabelBox& box = m_page.controls().LabeltextBox;
+    m_scale = m_shown.PicPicSize.width > 0 ? double(width()) / m_shown.PicPicSize.width : 1;
+    const TextLabelBox& box = m_shown.LabeltextBox;
     // A finger needs some room, however small the caption is.
     QRectF area(box.left * m_scale, box.top * m_scale, box.width * m_scale, box.height * m_scale);
     const QPointF middle = area.center();
@@ -63,36 +64,36 @@ void EditorPaper::render() {
     area.moveCenter(middle);
     if (m_caption->geometry() != area.toRect())
         m_caption->setGeometry(area.toRect());
-    if (m_caption->isHidden() == m_page.controls().Labeltext.visible)
-        m_caption->setVisible(m_page.controls().Labeltext.visible);
+    if (m_caption->isHidden() == m_shown.Labeltext.visible)
+        m_caption->setVisible(m_shown.Labeltext.visible);
     // The same bitmap draws the same: a change elsewhere on the page leaves the paper alone.
-    if (m_shown.cacheKey() != m_page.controls().PicPic.image().cacheKey() || m_page.controls().crop.visible) {
-        m_shown = m_page.controls().PicPic.image();
+    if (m_preview.cacheKey() != m_shown.PicPic.image().cacheKey() || m_shown.crop.visible) {
+        m_preview = m_shown.PicPic.image();
         update();
     }
 }
 
 void EditorPaper::paintEvent(QPaintEvent*) {
     QPainter painter(this);
-    if (m_shown.isNull()) {
+    if (m_preview.isNull()) {
         painter.fillRect(rect(), Qt::white);
         return;
     }
     const double ratio = devicePixelRatioF();
-    const bool asItIs = m_shown.size() == (QSizeF(size()) * ratio).toSize();
+    const bool asItIs = m_preview.size() == (QSizeF(size()) * ratio).toSize();
     painter.setRenderHint(QPainter::SmoothPixmapTransform, !asItIs);
-    painter.drawImage(rect(), m_shown);
-    if (!m_page.controls().crop.visible)
+    painter.drawImage(rect(), m_preview);
+    if (!m_shown.crop.visible)
         return;
     painter.setRenderHint(QPainter::Antialiasing);
     QPolygonF sides;
     for (const int at : {0, 1, 3, 2})
-        sides << QPointF(m_page.controls().crop.marker(corners[at])) * m_scale;
+        sides << QPointF(m_shown.crop.marker(corners[at])) * m_scale;
     painter.setPen(QPen(Theme::Colour::Sun, 2));
     painter.drawPolygon(sides);
     painter.setBrush(Theme::Colour::Sun);
     for (const CropFrame::Corner corner : corners)
-        painter.drawEllipse(m_page.controls().crop.handle(corner) * m_scale, 8, 8);
+        painter.drawEllipse(m_shown.crop.handle(corner) * m_scale, 8, 8);
 }
 
 void EditorPaper::drag(QEvent::Type type, QPointF at) {
@@ -123,8 +124,7 @@ void EditorPaper::mousePressEvent(QMouseEvent* event) {
     const QPointF at = onPaper(event->position());
     m_drag = Drag::Picture;
     for (const CropFrame::Corner corner : corners) {
-        if (m_page.controls().crop.visible &&
-            QLineF(at, m_page.controls().crop.handle(corner)).length() < handleRadius) {
+        if (m_shown.crop.visible && QLineF(at, m_shown.crop.handle(corner)).length() < handleRadius) {
             m_drag = Drag::CropHandle;
             m_page.CropHandle_MouseDown(corner, at);
             return;

@@ -32,8 +32,9 @@ private:
     void drag(QEvent::Type type, QPointF at);
 
     tFrmNew& m_page;
+    const tFrmNewControls& m_shown;
     QWidget* m_caption; // the dashed box, which lies over the picture
-    QImage m_shown;
+    QImage m_preview;
     double m_scale = 1; // of the widget's pixels to the paper's
     Drag m_drag = Drag::None;
 };

@@ -1,6 +1,6 @@
 #include "views/tFrmNew/FrameThumbs.h"
 
-#include "views/kit/Cards.h"
+#include "views/kit/Painting.h"
 
 #include <QKeyEvent>
 #include <QPainter>
@@ -46,23 +46,20 @@ public:
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
         painter->save();
-        painter->setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
-        const int inset = m_theme.px(4);
-        const QRectF card = QRectF(option.rect).adjusted(2, 2, -2, -2);
+        painter->setLayoutDirection(Qt::LeftToRight);
         const bool worn = index.row() == m_worn;
-        const bool current = option.state & QStyle::State_Selected;
-        painter->setPen(QPen(worn                                                ? Theme::Colour::Primary
-                             : option.state & QStyle::State_HasFocus             ? Theme::Colour::Focus
-                             : current || option.state & QStyle::State_MouseOver ? Theme::Colour::Edge
-                                                                                 : Theme::Colour::Line,
-                             worn ? m_theme.px(3) : m_theme.px(1)));
-        painter->setBrush(worn ? Theme::Colour::PrimarySoft : Theme::Colour::Surface);
-        painter->drawRoundedRect(card, m_theme.px(8), m_theme.px(8));
-        const QRectF room = card.adjusted(inset, inset, -inset, -inset);
+        const bool lively = option.state & (QStyle::State_Selected | QStyle::State_MouseOver);
+        const QRectF card = drawCard(*painter, option.rect.adjusted(1, 1, -1, -1),
+                                     worn                                    ? Theme::Colour::Primary
+                                     : option.state & QStyle::State_HasFocus ? Theme::Colour::Focus
+                                     : lively                                ? Theme::Colour::Edge
+                                                                             : Theme::Colour::Line,
+                                     worn ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
+                                     worn ? m_theme.thick() : m_theme.px(1), m_theme.px(8));
+        const int inset = m_theme.px(4);
         const QImage& frame = clear(index.row());
-        const QSizeF shape = frame.isNull() ? QSizeF(3, 2) : QSizeF(frame.size());
-        QRectF paper(QPointF(), shape.scaled(room.size(), Qt::KeepAspectRatio));
-        paper.moveCenter(room.center());
+        const QRectF paper =
+            fitted(card.adjusted(inset, inset, -inset, -inset), frame.isNull() ? QSizeF(3, 2) : QSizeF(frame.size()));
         drawSamplePicture(*painter, paper);
         if (frame.isNull()) {
             painter->setPen(Theme::Colour::Ink);
@@ -70,15 +67,9 @@ public:
         } else {
             painter->drawImage(paper, frame);
         }
-        if (worn) {
-            const double radius = m_theme.px(10);
-            const QPointF at(card.right() - radius - 2, card.top() + radius + 2);
-            painter->setPen(QPen(Qt::white, 2));
-            painter->setBrush(Theme::Colour::Primary);
-            painter->drawEllipse(at, radius, radius);
-            const int size = m_theme.px(14);
-            painter->drawPixmap(at - QPointF(size / 2.0, size / 2.0), m_theme.icon(u"tick"_s, size, Qt::white));
-        }
+        if (worn)
+            drawMark(*painter, m_theme, card,
+                     {.icon = u"tick"_s, .disc = Theme::Colour::Primary, .radius = 10, .inset = 2, .rim = 2});
         painter->restore();
     }
 

@@ -7,16 +7,10 @@
 #include "views/tFrmNew/EditorPaper.h"
 #include "views/tFrmNew/tFrmNewView.h"
 
-#include <QCheckBox>
 #include <QComboBox>
-#include <QGridLayout>
-#include <QHBoxLayout>
-#include <QLabel>
 #include <QMouseEvent>
 #include <QPainter>
-#include <QPushButton>
 #include <QSlider>
-#include <QVBoxLayout>
 
 #include <algorithm>
 #include <array>
@@ -92,116 +86,77 @@ private:
 } // namespace
 
 void tFrmNewView::makeTonePanel() {
-    m_tonePanel = new QFrame(this);
-    setRole(m_tonePanel, "card");
-    auto* row = new QHBoxLayout(m_tonePanel);
-    row->setContentsMargins(theme().px(8), theme().px(8), theme().px(8), theme().px(8));
-    row->setSpacing(theme().px(5));
-    const auto tone = [&](const QString& name, const Caption& caption, std::array<double, 3> gains, bool grey,
-                          std::function<void()> clicked) {
-        ToolButton* made = tool(name, caption, u"tones"_s, inPanel, std::move(clicked));
+    const auto tone = [&](const Caption& caption, std::array<double, 3> gains, bool grey, Click clicked) {
+        ToolButton* made = tool(caption, u"tones"_s, inPanel, clicked);
         made->setPicture(toneSample(theme(), gains, grey));
-        row->addWidget(made);
+        return made;
     };
-    tFrmNew& page = m_page;
-    tone(u"Image5"_s, m_shows.Image5, {1, 1, 1}, false, [&page] { page.Image5_Click(); });
-    tone(u"Image4"_s, m_shows.Image4, {1, 1, 1}, true, [&page] { page.Image4_Click(); });
-    tone(u"Image11"_s, m_shows.Image11, {1.3, 1, 0.8}, true, [&page] { page.Image11_Click(); });
-    tone(u"Image12"_s, m_shows.Image12, {1, 1, 1.3}, true, [&page] { page.Image12_Click(); });
-    tone(u"Image9"_s, m_shows.Image9, {1, 1.3, 1}, true, [&page] { page.Image9_Click(); });
-    bind(u"Frame3"_s, m_tonePanel, m_shows.Frame3);
+    const Card panel = makeCard("card", Pad::Tight);
+    panel.column->addLayout(inRow(Space::Tight, {tone(c.Image5, {1, 1, 1}, false, &tFrmNew::Image5_Click),
+                                                 tone(c.Image4, {1, 1, 1}, true, &tFrmNew::Image4_Click),
+                                                 tone(c.Image11, {1.3, 1, 0.8}, true, &tFrmNew::Image11_Click),
+                                                 tone(c.Image12, {1, 1, 1.3}, true, &tFrmNew::Image12_Click),
+                                                 tone(c.Image9, {1, 1.3, 1}, true, &tFrmNew::Image9_Click)}));
+    m_tonePanel = panel.frame;
+    bind(m_tonePanel, c.Frame3);
 }
 
 void tFrmNewView::makeTurnPanel() {
-    m_turnPanel = new QFrame(this);
-    setRole(m_turnPanel, "card");
-    // Left is left in both languages.
-    m_turnPanel->setLayoutDirection(Qt::LeftToRight);
-    auto* row = new QHBoxLayout(m_turnPanel);
-    row->setContentsMargins(theme().px(8), theme().px(8), theme().px(8), theme().px(8));
-    row->setSpacing(theme().px(5));
-    tFrmNew& page = m_page;
-    row->addWidget(tool(u"Image18"_s, m_shows.Image18, u"quarter-left"_s, inPanel, [&page] { page.Image18_Click(); }));
-    row->addWidget(held(
-        u"Image17"_s, m_shows.Image17, u"turn-left"_s, inPanel, [&page] { page.Image17_MouseDown(); },
-        [&page] { page.Image17_MouseUp(); }));
-    m_angle = makeLabel(m_turnPanel, "large");
+    const auto turn = [&](const Caption& caption, const QString& icon, Click down, Click up) {
+        return heldTool(caption, icon, inPanel, toPage(down), toPage(up));
+    };
+    const Card panel = makeCard("card", Pad::Tight);
+    auto* quarter = tool(c.Image18, u"quarter-left"_s, inPanel, &tFrmNew::Image18_Click);
+    auto* left = turn(c.Image17, u"turn-left"_s, &tFrmNew::Image17_MouseDown, &tFrmNew::Image17_MouseUp);
+    m_angle = oneLine("large");
     m_angle->setAlignment(Qt::AlignCenter);
-    m_angle->setWordWrap(false);
     m_angle->setMinimumWidth(theme().px(60));
-    bind(u"Label10"_s, m_angle, [this] { return m_shows.Label10.text; });
-    row->addWidget(m_angle);
-    row->addWidget(held(
-        u"Image16"_s, m_shows.Image16, u"turn-right"_s, inPanel, [&page] { page.Image16_MouseDown(); },
-        [&page] { page.Image16_MouseUp(); }));
-    row->addWidget(tool(u"Image27"_s, m_shows.Image27, u"upright"_s, inPanel, [&page] { page.Image27_Click(); }));
-    bind(u"Frame4"_s, m_turnPanel, m_shows.Frame4);
+    bindName(m_angle, c.Label10);
+    auto* right = turn(c.Image16, u"turn-right"_s, &tFrmNew::Image16_MouseDown, &tFrmNew::Image16_MouseUp);
+    auto* upright = tool(c.Image27, u"upright"_s, inPanel, &tFrmNew::Image27_Click);
+    panel.column->addLayout(inRow(Space::Tight, {quarter, left, m_angle, right, upright}));
+    m_turnPanel = panel.frame;
+    m_turnPanel->setLayoutDirection(Qt::LeftToRight); // left is left in both languages
+    bind(m_turnPanel, c.Frame4);
 }
 
 // What doubles another control or shows the customer nothing is for the operator.
 void tFrmNewView::makeOperatorPanel() {
-    tFrmNew& page = m_page;
-    bindHidden(u"Frame5"_s, m_shows.Frame5);
-    m_operatorPanel = new QFrame(this);
-    setRole(m_operatorPanel, "notice");
+    const Card panel = makeCard("notice", Pad::Tight);
+    m_operatorPanel = panel.frame;
     m_operatorPanel->hide();
-    m_operator = new QPushButton(this);
-    setRole(m_operator, "quiet");
-    m_operator->setObjectName(u"Frame5Opener"_s);
-    m_operator->setFocusPolicy(Qt::TabFocus);
-    setIcon(m_operator, u"gear"_s, Theme::Colour::Ink);
-    speak(m_operator, m_shows.words.operatorPanel);
-    connect(m_operator, &QPushButton::clicked, this, [this] {
+    m_operator = plainButton(u"Frame5Opener"_s, "quiet", [this] {
         m_operatorPanel->setVisible(m_operatorPanel->isHidden());
         placePanels();
     });
+    setIcon(m_operator, u"gear"_s, Theme::Colour::Ink);
     frame().addHeaderAction(m_operator);
 
-    auto* column = new QVBoxLayout(m_operatorPanel);
-    column->setSpacing(theme().px(6));
-    const auto addRow = [&] {
-        auto* row = new QHBoxLayout;
-        row->setSpacing(theme().px(6));
-        column->addLayout(row);
-        return row;
-    };
-    QHBoxLayout& sizes = *addRow();
-    addPlain(sizes, u"Command24"_s, m_shows.Command24, &tFrmNew::Command24_Click);
-    addPlain(sizes, u"Command12"_s, m_shows.Command12, &tFrmNew::Command12_Click);
-    addPlain(sizes, u"Command10"_s, m_shows.Command10, &tFrmNew::Command10_Click);
-    addPlain(sizes, u"Command23"_s, m_shows.Command23, &tFrmNew::Command23_Click);
-    addPlain(sizes, u"Command4"_s, m_shows.Command4, &tFrmNew::Command4_Click);
-    addPlain(sizes, u"Command2"_s, m_shows.Command2, &tFrmNew::Command2_Click);
-    addPlain(sizes, u"Command6"_s, m_shows.Command6, &tFrmNew::Command6_Click);
-    QHBoxLayout& lines = *addRow();
-    m_palette = new Palette(page, m_operatorPanel);
-    bind(u"pic4Msgrt"_s, m_palette, [this] { return m_shows.Label4.text; });
-    bindHidden(u"Label4"_s, m_shows.Label4);
-    lines.addWidget(m_palette);
-    auto* styles = comboBox(u"Combo5"_s, m_shows.Combo5List, m_shows.Combo5, [](int) {});
-    speak(styles, m_shows.words.lineStyles);
-    lines.addWidget(styles);
-    addPlain(lines, u"Command18"_s, m_shows.Command18, &tFrmNew::Command18_Click);
-    addPlain(lines, u"Command9"_s, m_shows.Command9, &tFrmNew::Command9_Click);
-    QHBoxLayout& crop = *addRow();
-    addPlain(crop, u"Command14"_s, m_shows.Command14, &tFrmNew::Command14_Click);
-    addPlain(crop, u"Command13"_s, m_shows.Command13, &tFrmNew::Command13_Click);
-    addPlain(crop, u"Command16"_s, m_shows.Command16, &tFrmNew::Command16_Click);
-    addPlain(crop, u"Command15"_s, m_shows.Command15, &tFrmNew::Command15_Click);
+    const auto plain = [&](const Caption& caption, Click clicked) { return button(caption, Role::Plain, clicked); };
+    QLayout* sizes = inRow(
+        Space::Small, {plain(c.Command24, &tFrmNew::Command24_Click), plain(c.Command12, &tFrmNew::Command12_Click),
+                       plain(c.Command10, &tFrmNew::Command10_Click), plain(c.Command23, &tFrmNew::Command23_Click),
+                       plain(c.Command4, &tFrmNew::Command4_Click), plain(c.Command2, &tFrmNew::Command2_Click),
+                       plain(c.Command6, &tFrmNew::Command6_Click)});
+    m_palette = new Palette(m_page, m_operatorPanel);
+    bind(u"pic4Msgrt"_s, m_palette, [this] { return c.Label4.text; });
+    m_lineStyles = comboBox(c.Combo5List, c.Combo5, [](int) {});
+    QLayout* lines = inRow(Space::Small, {m_palette, m_lineStyles, plain(c.Command18, &tFrmNew::Command18_Click),
+                                          plain(c.Command9, &tFrmNew::Command9_Click)});
     auto* bar = new QSlider(Qt::Horizontal, m_operatorPanel);
     bar->setRange(tFrmNewControls::VScrollZMin, tFrmNewControls::VScrollZMax);
     bar->setMinimumHeight(theme().target());
-    bar->setValue(m_shows.VScrollZ);
-    connect(bar, &QSlider::valueChanged, this, [&page](int value) { page.VScrollZ_Change(value); });
-    bind(u"VScrollZ"_s, bar, [this] { return QString::number(m_shows.VScrollZ); });
-    crop.addWidget(bar, 1);
-    auto* record = label(u"Label13"_s, m_shows.Label13, "small");
+    bar->setValue(c.VScrollZ);
+    connect(bar, &QSlider::valueChanged, this, toPage(&tFrmNew::VScrollZ_Change));
+    bind(u"VScrollZ"_s, bar, [this] { return QString::number(c.VScrollZ); });
+    QLayout* crop = inRow(Space::Small, {plain(c.Command14, &tFrmNew::Command14_Click),
+                                         plain(c.Command13, &tFrmNew::Command13_Click),
+                                         plain(c.Command16, &tFrmNew::Command16_Click),
+                                         plain(c.Command15, &tFrmNew::Command15_Click),
+                                         {bar, 1}});
+    QLabel* record = label(c.Label13, "small");
     record->setLayoutDirection(Qt::LeftToRight);
-    column->addWidget(record);
-}
-
-void tFrmNewView::addPlain(QHBoxLayout& row, const QString& name, const Caption& caption, Click click) {
-    row.addWidget(button(name, caption, Role::Plain, [&page = m_page, click] { (page.*click)(); }));
+    add(*panel.column, {sizes, lines, crop, record});
 }
 
 // --- the hints in words, for who can't hover ---
@@ -209,37 +164,24 @@ void tFrmNewView::addPlain(QHBoxLayout& row, const QString& name, const Caption&
 void tFrmNewView::makeHints() {
     m_hints = new Overlay(theme(), this);
     m_hints->setWidth(Overlay::Width::Full);
-    m_hints->column()->setContentsMargins(theme().px(24), theme().px(20), theme().px(24), theme().px(18));
-    m_hints->column()->setSpacing(theme().px(10));
-    auto* grid = new QGridLayout;
-    grid->setHorizontalSpacing(theme().px(26));
-    grid->setVerticalSpacing(theme().px(5));
+    QGridLayout* grid = inGrid(Space::Tight);
+    grid->setHorizontalSpacing(theme().size(Space::Far));
     const auto rows = static_cast<int>((m_hintLines.size() + 1) / 2);
-    int at = 0;
     for (auto& [line, caption] : m_hintLines) {
+        const int at = grid->count();
         line = makeLabel(m_hints->card(), "small");
         grid->addWidget(line, at % rows, at / rows);
-        ++at;
+        grid->setColumnStretch(at / rows, 1);
     }
-    grid->setColumnStretch(0, 1);
-    grid->setColumnStretch(1, 1);
     m_hints->column()->addLayout(grid);
-    m_hintsClose = new QPushButton(m_hints->card());
-    setRole(m_hintsClose, "main");
-    m_hintsClose->setObjectName(u"hintsClose"_s);
-    m_hintsClose->setFocusPolicy(Qt::TabFocus);
-    connect(m_hintsClose, &QPushButton::clicked, this, [&page = m_page] { page.Image29_Click(); });
-    m_hints->column()->addWidget(m_hintsClose, 0, Qt::AlignTrailing);
-    m_hints->setFirstFocus(m_hintsClose);
-    connect(m_hints, &Overlay::escaped, this, [&page = m_page] { page.Image29_Click(); });
+    m_hints->addButton(button(c.hintsClose, Role::Main, &tFrmNew::Image29_Click));
+    m_hints->whenEscaped(toPage(&tFrmNew::Image29_Click));
 }
 
 void tFrmNewView::renderHints() {
     for (const auto& [line, caption] : m_hintLines)
         line->setText(isolated(tFrmNew::hintLine(*caption)));
-    m_hintsClose->setText(m_shows.words.closeHints);
-    m_hintsClose->setAccessibleName(m_hintsClose->text());
-    m_hints->setOpen(m_shows.hintsAsLabels);
+    m_hints->setOpen(c.hintsAsLabels);
 }
 
 // --- where they stand ---
