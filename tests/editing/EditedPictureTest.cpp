@@ -97,18 +97,13 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         const char* record;
     };
     const Case cases[] = {
-        {"lying.png", {10, 15}, "1   1   1   180100225 150 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   195150245 140 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   16760 200 170 0  0  000"},
         {"lying.png", {10, 15}, "1.3 1   0.8 360210300 90  1  0  000"},
-        {"lying.png", {10, 15}, "0.87 1  1.48090100225 150 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   18140 780 780 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   180100999 999 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   180100225 150 0  0  ab 000000000blue"},
-        {"lying.png", {13, 18}, "1   1   1   180100225 162 0  0  000"},
         {"lying.png", {13, 18}, "1.48-0.51   21370 -40 162 0  0  cd 000000000blue"},
-        {"lying.png", {13, 18}, "1   1   1   -99130225 400 1  0  000"},
-        {"upright.png", {13, 18}, "1   1   1   180100150 207 0  0  000"},
         {"upright.png", {13, 18}, "1   1.3 1   27080 130 217 1  0  000"},
         {"upright.png",
          {13, 18},
@@ -174,24 +169,19 @@ TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
         EXPECT_FALSE(frame("blue", name, FrameUse::Preview).isValid()) << name;
 }
 
-TEST_F(EditedPictureTest, aPictureNeverOpenedPrintsStretchedToThePaper) {
-    const Bitmap paper = print("lying.png", fieldsOf(EditRecord::newPicture()));
-    ASSERT_EQ(paper.width(), 1500);
+TEST_F(EditedPictureTest, aPictureNeverOpenedPrintsStretchedAndOneThatCanNotBeReadIsAFailure) {
+    const QImage unopened = print("lying.png", fieldsOf(EditRecord::newPicture())).image();
     const auto whole = loadPictureScaled(path("lying.png"), {1500, 1000});
     ASSERT_TRUE(whole);
-    EXPECT_EQ(paper.image(), whole->image().convertToFormat(paper.image().format()));
-}
-
-TEST_F(EditedPictureTest, aPictureThatCanNotBeReadIsAFailureAndARecordOfLettersIsNone) {
+    EXPECT_EQ(unopened, whole->image().convertToFormat(unopened.format()));
+    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'x'))).image(), unopened) << "a record of letters is none";
+    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'9'))).width(), 1500);
+    EXPECT_EQ(preview("lying.png", fieldsOf(QString(200, u'-'))).width(), 450);
     EXPECT_FALSE(EditedPreview::open(path("none.jpg"), {10, 15}, 100, EditedPreview::Tone::Colour));
     EditedPrint request;
     request.file = path("frames");
     request.paper = {10, 15};
     EXPECT_FALSE(renderEditedPrintToJpeg(request, EditFields()));
-    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'x'))).image(),
-              print("lying.png", fieldsOf(EditRecord::newPicture())).image());
-    EXPECT_EQ(print("lying.png", fieldsOf(QString(200, u'9'))).width(), 1500);
-    EXPECT_EQ(preview("lying.png", fieldsOf(QString(200, u'-'))).width(), 450);
 }
 
 // The box of the pixels that are not white.
@@ -248,15 +238,14 @@ TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
 }
 
 TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
-    PictureCaption caption;
-    caption.text = u"שלום Lumora 2024"_s;
-    caption.family = u"No Such Family"_s;
-    Bitmap paper(200, 60, Qt::white);
-    drawInk(paper, inkOf(caption, {200, 60}));
-    EXPECT_TRUE(darkBox(paper).isNull());
-    caption.family = u"David"_s;
-    drawInk(paper, inkOf(caption, {200, 60}));
-    EXPECT_FALSE(darkBox(paper).isNull());
+    for (const auto& [family, drawn] : {std::pair(u"No Such Family"_s, false), std::pair(u"David"_s, true)}) {
+        PictureCaption caption;
+        caption.text = u"שלום Lumora 2024"_s;
+        caption.family = family;
+        Bitmap paper(200, 60, Qt::white);
+        drawInk(paper, inkOf(caption, {200, 60}));
+        EXPECT_EQ(!darkBox(paper).isNull(), drawn) << qPrintable(family);
+    }
 }
 
 TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
@@ -268,19 +257,15 @@ TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
     PaperScale scale;
     const std::function<void()> steps[] = {
         [&] { caption.x = 40; },
-        [&] { caption.x = -30; },
         [&] { caption.y = 190; },
         [&] { caption.emSize = 31; },
         [&] { caption.align = PictureCaption::Align::Centre; },
         [&] {
             scale = {1.5, 1.5};
         },
-        [&] { caption.x = 51; },
         [&] { caption.run = PictureCaption::Run::Down; },
         [&] { caption.colour = Qt::red; },
-        [&] { caption.bold = true; },
         [&] { caption.emSize = 99; }, // larger than the paper: no longer kept
-        [&] { caption.x = 60; },
         [&] { caption.text = u"A"_s; },
         [&] { caption.family = u"No Such Family"_s; },
         [&] { caption.family = u"DejaVu Sans"_s; },

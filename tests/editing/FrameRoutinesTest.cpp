@@ -26,7 +26,6 @@ protected:
     void write(const QString& path, const QByteArray& bytes) {
         ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok());
     }
-    QStringList names(const QString& folder) { return machine.files.names(folder, u"*.*"_s); }
 
     TestPlatform machine;
     SessionState state;
@@ -61,48 +60,35 @@ TEST_F(FrameRoutines, ChannelMinimumsAreWrittenGreenBlueRedAndReadInAnyOrderAndP
 }
 
 TEST_F(FrameRoutines, ScramblingExchangesTheFirstTwoBlocksAndUndoesItself) {
+    write(frame, QByteArray(99'999, 'a'));
+    const auto small = ScrambleFrameFile(state, machine.files, frame);
+    ASSERT_TRUE(small.ok());
+    EXPECT_EQ(*small, QString()) << "too small";
+    EXPECT_FALSE(machine.files.folderExists(results));
+
     QByteArray bytes;
     for (int i = 0; i < 100'000; ++i)
         bytes.append(static_cast<char>(i * 7 + i / 251));
     write(frame, bytes);
+    ASSERT_TRUE(machine.files.makeFolder(pieces).ok());
+    write(pieces + u"\\kzz.bmp"_s, "left by an interrupted run");
     const auto once = ScrambleFrameFile(state, machine.files, frame);
     ASSERT_TRUE(once.ok());
     EXPECT_EQ(*once, packed);
     EXPECT_EQ(read(packed), bytes.mid(23000, 23000) + bytes.first(23000) + bytes.mid(46000));
     EXPECT_EQ(read(frame), bytes);
-    EXPECT_EQ(names(pieces), QStringList());
+    EXPECT_EQ(machine.files.names(pieces, u"*.*"_s), QStringList());
     ASSERT_TRUE(ScrambleFrameFile(state, machine.files, packed).ok());
     EXPECT_EQ(read(packed), bytes);
-}
-
-TEST_F(FrameRoutines, ScramblingLeavesSmallFilesAloneAndClearsWhatAnInterruptedRunLeft) {
-    write(frame, QByteArray(99'999, 'a'));
-    const auto small = ScrambleFrameFile(state, machine.files, frame);
-    ASSERT_TRUE(small.ok());
-    EXPECT_EQ(*small, QString());
-    EXPECT_FALSE(machine.files.folderExists(results));
-
-    ASSERT_TRUE(machine.files.makeFolder(pieces).ok());
-    write(pieces + u"\\kzz.bmp"_s, "half a join");
-    write(frame, QByteArray(100'000, 'a'));
-    ASSERT_TRUE(ScrambleFrameFile(state, machine.files, frame).ok());
-    EXPECT_EQ(read(packed), QByteArray(100'000, 'a'));
-    EXPECT_EQ(names(pieces), QStringList());
 }
 
 TEST_F(FrameRoutines, AScramblingThatFailsLosesNothing) {
     EXPECT_FALSE(ScrambleFrameFile(state, machine.files, u"C:\\none.bmp"_s).ok());
     write(frame, QByteArray(120'000, 'a'));
-    // A file stands where the folder should be.
-    write(results, "in the way");
+    write(results, "in the way of the folder");
     EXPECT_FALSE(ScrambleFrameFile(state, machine.files, frame).ok());
     EXPECT_EQ(read(frame), QByteArray(120'000, 'a'));
-    EXPECT_EQ(read(results), QByteArray("in the way"));
-}
-
-// How much of the line's colour is in a pixel of a black box, 0 to 250.
-int ink(const QImage& image, int x, int y) {
-    return image.pixelColor(x, y).red();
+    EXPECT_EQ(read(results), QByteArray("in the way of the folder"));
 }
 
 QImage lineFrame(const QString& code, int width = 450, int height = 300) {
@@ -114,46 +100,34 @@ QImage lineFrame(const QString& code, int width = 450, int height = 300) {
 TEST(PaintLineFrame, PutsTheInkOfEachStyleWhereItsTableSays) {
     struct Case {
         const char* code;
-        int x, y;
-        int ink; // of 250
+        int x, y, alpha;
     };
-    constexpr double whole = 250;
-    const auto blended = [](int alpha) { return static_cast<int>(whole * alpha / 255); };
     for (const Case& c :
          {// Thin rectangles, one a pixel, from 255 down by 2 or 3 a step.
-          Case{"W03", 0, 150, 250}, Case{"W03", 10, 150, blended(235)}, Case{"W03", 100, 150, blended(55)},
-          Case{"W03", 140, 150, 0}, Case{"W13", 10, 150, blended(225)}, Case{"W13", 90, 150, 0},
-          Case{"W17", 22, 150, blended(205 - 66)}, Case{"W17", 23, 150, 0},
-          // The ellipse that touches the edges, growing outwards: the middle of an edge, and nothing inside.
-          Case{"W04", 225, 30, 0}, Case{"W14", 225, 150, 0}, Case{"W16", 225, 150, 0},
-          // An edge whose pen lies half outside.
-          Case{"W21", 9, 150, blended(211)}, Case{"W21", 11, 150, 0}, Case{"W22", 9, 150, blended(155)},
-          Case{"W29", 29, 150, blended(211)}, Case{"W29", 31, 150, 0},
-          // A second line of 12 around half the first width.
-          Case{"W31", 15, 150, blended(200)}, Case{"W31", 17, 150, 0},
-          // The innermost line of the glow.
-          Case{"W41", 20, 150, blended(183)}, Case{"W41", 22, 150, 0}})
-        EXPECT_NEAR(ink(lineFrame(QString::fromLatin1(c.code)), c.x, c.y), c.ink, 2)
+          Case{"W03", 0, 150, 255}, Case{"W03", 100, 150, 55}, Case{"W03", 140, 150, 0}, Case{"W13", 10, 150, 225},
+          Case{"W17", 22, 150, 205 - 66}, Case{"W17", 23, 150, 0},
+          // The ellipse grows out of the box: its inside stays clear.
+          Case{"W04", 225, 30, 0}, Case{"W14", 225, 150, 0},
+          // An edge whose pen lies half outside, a second line of 12 in it, the innermost line of a glow.
+          Case{"W21", 9, 150, 211}, Case{"W21", 11, 150, 0}, Case{"W29", 29, 150, 211}, Case{"W31", 15, 150, 200},
+          Case{"W31", 17, 150, 0}, Case{"W41", 20, 150, 183}, Case{"W41", 22, 150, 0}})
+        EXPECT_NEAR(lineFrame(QString::fromLatin1(c.code)).pixelColor(c.x, c.y).red(), 250 * c.alpha / 255, 2)
             << c.code << " at " << c.x << ", " << c.y;
+    EXPECT_EQ(lineFrame(u"S03"_s).pixelColor(0, 150), QColor(240, 120, 0));
+    EXPECT_EQ(lineFrame(u"X03"_s).pixelColor(0, 150), QColor(Qt::black)) << "a letter without a colour";
 }
 
 TEST(PaintLineFrame, DrawsTheStylesOfTheTableAndNoOthersOnABoxOfAnySize) {
     for (const QSize size : {QSize(300, 450), QSize(7, 3), QSize(1, 1)}) {
+        const QImage plain = Bitmap(size.width(), size.height(), Qt::black).image();
         for (int style = 1; style <= 60; ++style) {
             const bool drawn = style <= 6 || (style >= 13 && style <= 19) || (style >= 21 && style <= 50);
             const QImage image = lineFrame(u"W%1"_s.arg(style, 2, 10, QLatin1Char('0')), size.width(), size.height());
-            const QImage plain = Bitmap(size.width(), size.height(), Qt::black).image();
             if (!drawn || size.width() == 300) {
                 EXPECT_EQ(image != plain, drawn) << style;
             }
         }
     }
-}
-
-TEST(PaintLineFrame, TakesTheColourOfItsLetter) {
-    EXPECT_EQ(lineFrame(u"X03"_s).pixelColor(0, 150), QColor(Qt::black)) << "a letter without a colour";
-    EXPECT_EQ(lineFrame(u"S03"_s).pixelColor(0, 150), QColor(240, 120, 0));
-    EXPECT_EQ(lineFrame(u"T03"_s).pixelColor(0, 150), QColor(0, 250, 250));
 }
 
 } // namespace

@@ -37,14 +37,5 @@ TEST(KeyLayout, LiesAsOnARealKeyboardInBothLanguages) {
     EXPECT_EQ(hebrew, u"  קראטוןםפשדגכעיחלךףזסבהנמצתץ,"_s);
 }
 
-TEST(KeyLayout, TakesFromARealKeyboardWhatCanBePrinted) {
-    EXPECT_EQ(KeyLayout::typed(u'ש'), u"ש"_s);
-    EXPECT_EQ(KeyLayout::typed(u'ñ'), std::nullopt);
-    EXPECT_EQ(KeyLayout::typed(u'"'), u"\u05F4"_s) << "a quoted text of the log can't hold the double quote";
-    EXPECT_EQ(KeyLayout::typed(u'\t'), std::nullopt);
-    EXPECT_EQ(KeyLayout::typed(QChar(0x0090)), std::nullopt);
-    EXPECT_EQ(KeyLayout::typed(QChar(0xD83D)), std::nullopt) << "half of a smiley";
-}
-
 } // namespace
 } // namespace lumora

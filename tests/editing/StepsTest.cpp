@@ -1,14 +1,11 @@
 // The steps of the editor's and its keyboard's buttons, in the fields of a record.
 #include "editing/caption/CaptionStep.h"
-#include "editing/editor/ColourStep.h"
 #include "editing/editor/LineFrameChoice.h"
 #include "editing/render/TextLabelPlace.h"
 #include "order/EditRecord.h"
 #include "session/SessionState.h"
 
 #include <gtest/gtest.h>
-
-#include <functional>
 
 namespace lumora {
 namespace {
@@ -23,41 +20,6 @@ TEST(EditStep, StaysWithinTheRangeOfItsButton) {
         {quarterRight(500), 230}, {quarterLeft(230), 500},    {quarterLeft(270), 180}};
     for (const auto& [stepped, expected] : cases)
         EXPECT_EQ(stepped, expected);
-}
-
-TEST(ColourStep, ChangesGainsAndToneOneAfterTheOther) {
-    struct Case {
-        std::function<void(EditFields&)> step;
-        const char* gains;
-        int tone;
-    };
-    const auto toned = [](ColourStep::Tone tone) {
-        return [tone](EditFields& edit) { ColourStep::takeTone(edit, tone); };
-    };
-    const auto brighter = [](int hundredths) {
-        return [hundredths](EditFields& edit) { ColourStep::brighten(edit, hundredths); };
-    };
-    using enum ColourStep::Tone;
-    EditFields edit;
-    edit.FrameName = u"017"_s;
-    edit.TextBody = u"Dana"_s;
-    for (const Case& c :
-         {Case{brighter(20), "1.2 1.2 1.2 ", 0}, Case{ColourStep::addRed, "1.261.2 1.14", 0},
-          Case{ColourStep::removeAddedColours, "1.2 1.2 1.2 ", 0}, Case{ColourStep::addBlue, "1.141.2 1.26", 0},
-          Case{toned(Sepia), "1.3 1   0.8 ", 1}, Case{toned(Blue), "1   1   1.3 ", 1},
-          Case{toned(Green), "1   1.3 1   ", 1}, Case{toned(Grey), "1   1   1   ", 1},
-          Case{brighter(-4), "0.960.960.96", 1}, Case{ColourStep::backToColour, "1   1   1   ", 0},
-          Case{toned(Sepia), "1.3 1   0.8 ", 1}, Case{ColourStep::undo, "1   1   1   ", 0}}) {
-        c.step(edit);
-        PackEditState(edit, u"NB"_s, {});
-        EXPECT_EQ(edit.EditState.left(12), QString::fromLatin1(c.gains));
-        EXPECT_EQ(edit.ToneFlag, c.tone) << c.gains;
-    }
-    edit.ZoomPercent = edit.RotationCode = 77;
-    ColourStep::undo(edit);
-    EXPECT_EQ(edit.ZoomPercent, 100);
-    EXPECT_EQ(edit.RotationCode, 180);
-    EXPECT_EQ(edit.FrameName + edit.TextBody, u"017Dana"_s);
 }
 
 TEST(CaptionStep, MovesGrowsAndGoesItsRounds) {
@@ -81,17 +43,11 @@ TEST(CaptionStep, MovesGrowsAndGoesItsRounds) {
 TEST(LineFrameChoice, StepsThroughTheStylesWithoutTurningRound) {
     LineFrameChoice choice;
     EXPECT_FALSE(choice.step(-1)) << "nothing was chosen yet";
-    struct Case {
-        int steps;
-        const char* code;
-    };
-    for (const Case& c : {Case{3, "W05"}, Case{30, "W29"}, Case{-1, "W28"}, Case{-30, "W01"}, Case{-1, "W01"}}) {
-        for (int i = 0; i < std::abs(c.steps); ++i)
-            EXPECT_TRUE(choice.step(c.steps > 0 ? 1 : -1));
-        EXPECT_EQ(choice.code(), QString::fromLatin1(c.code));
+    for (const auto& [steps, code] : {std::pair(3, "W05"), std::pair(30, "W29"), std::pair(-30, "W01")}) {
+        for (int i = 0; i < std::abs(steps); ++i)
+            EXPECT_TRUE(choice.step(steps > 0 ? 1 : -1));
+        EXPECT_EQ(choice.code(), QString::fromLatin1(code));
     }
-    choice.takeColour(u'Y');
-    EXPECT_EQ(choice.code() + choice.removedCode(), u"Y01Y00"_s);
 }
 
 TEST(TextLabelPlace, PlacesTheCaptionsBoxAndFindsTheAnchorBack) {

@@ -34,60 +34,48 @@ protected:
     int startStatus = 0;
 };
 
-TEST_F(SavingPictures, eachButtonSavesItsPictureUnderItsName) {
-    page().saveScratch(picture);
-    page().saveProof(small);
-    EXPECT_TRUE(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_s, {20, 10}));
-    EXPECT_TRUE(isPicture(u"C:\\2000lumora\\000.jpg"_s, {8, 6}));
-    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
+TEST_F(SavingPictures, savesEachPictureUnderItsNameOnceTheDrawingStarted) {
+    startStatus = 18;
+    for (const bool started : {false, true}) {
+        page().saveScratch(picture);
+        page().saveOrderSheet(picture);
+        page().saveProof(small);
+        EXPECT_EQ(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_s, {20, 10}), started);
+        EXPECT_EQ(isPicture(u"C:\\2000lumora\\000.jpg"_s, {8, 6}), started);
+        EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), started);
+        EXPECT_EQ(machine.dialogs.messages,
+                  QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
+        startStatus = 0;
+        chain.unload(PageId::gdisave);
+    }
 }
 
 TEST_F(SavingPictures, theSheetsNameFollowsTheSenderAndTheStation) {
     struct Case {
-        std::int16_t sender;
+        Sender sender;
         bool station, jpp, jpg;
     };
-    for (const Case& c : {Case{0, false, true, false}, Case{0, true, true, true}, Case{1, false, false, true},
-                          Case{1, true, false, true}}) {
-        state.transfer.SugSheliach = static_cast<Sender>(c.sender);
+    for (const Case& c : {Case{Sender::Ftp, false, true, false}, Case{Sender::Ftp, true, true, true},
+                          Case{Sender::Http, false, false, true}, Case{Sender::Http, true, false, true}}) {
+        state.transfer.SugSheliach = c.sender;
         state.TachanaMekomit = c.station;
         page().saveOrderSheet(picture);
-        EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), c.jpp);
-        EXPECT_EQ(isPicture(sheet(".jpg"), {20, 10}), c.jpg);
-        static_cast<void>(machine.files.removeFile(sheet(".jpp")));
-        static_cast<void>(machine.files.removeFile(sheet(".jpg")));
+        for (const auto& [ending, there] : {std::pair(".jpp", c.jpp), std::pair(".jpg", c.jpg)}) {
+            EXPECT_EQ(isPicture(sheet(ending), {20, 10}), there);
+            std::filesystem::remove(host(sheet(ending)));
+        }
     }
-}
-
-TEST_F(SavingPictures, doesNothingWhenTheDrawingDidNotStart) {
-    startStatus = 18;
-    page().saveScratch(picture);
-    page().saveOrderSheet(picture);
-    page().saveProof(small);
-    EXPECT_EQ(machine.dialogs.messages,
-              QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
-    EXPECT_EQ(machine.dialogs.titles, QStringList({u"GDI Error"_s, u"GDI Error"_s}));
-    EXPECT_TRUE(machine.files.names(u"C:\\2000lumora\\!!000"_s, u"*.*"_s).isEmpty());
-    EXPECT_TRUE(machine.files.names(u"C:\\2000lumora"_s, u"*.*"_s).isEmpty());
 }
 
 TEST_F(SavingPictures, tellsWhyAPictureCouldNotBeSavedAndGoesOn) {
     EXPECT_FALSE(page().SaveJpeg(picture, u"C:\\missing\\a.jpg"_s, 90));
-    ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages[0].startsWith(u"File Not Found. GDI+ Error:10\n"_s));
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"C:\\missing\\a.jpg"_s));
     EXPECT_FALSE(page().SaveJpeg({}, u"C:\\2000lumora\\a.jpg"_s, 90));
     EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\a.jpg"_s));
-}
-
-TEST_F(SavingPictures, knowsItsStatusTextsAndItsEncoder) {
-    for (const auto& [status, text] : {std::pair(1, "Generic Error."), std::pair(17, "Unsupported Gdiplus Version."),
-                                       std::pair(20, "Property Not Supported."), std::pair(21, "Unknown GDI+ Error."),
-                                       std::pair(-1, "Unknown GDI+ Error.")})
-        EXPECT_EQ(gdisave::GdiStatusText(status), QString::fromLatin1(text));
-    EXPECT_EQ(page().ShowGdiStatus(0), 0);
-    EXPECT_TRUE(machine.dialogs.messages.isEmpty());
-    EXPECT_TRUE(gdisave::FindEncoderClsid(u"IMAGE/JPEG"_s));
+    ASSERT_EQ(machine.dialogs.messages.size(), 2);
+    EXPECT_TRUE(machine.dialogs.messages[0].startsWith(u"File Not Found. GDI+ Error:10\n"_s));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"C:\\missing\\a.jpg"_s));
+    EXPECT_EQ(gdisave::GdiStatusText(20), u"Property Not Supported."_s);
+    EXPECT_EQ(gdisave::GdiStatusText(21), u"Unknown GDI+ Error."_s);
     EXPECT_FALSE(gdisave::FindEncoderClsid(u"image/webp"_s));
     page().HScroll1_Change(150);
     EXPECT_EQ(page().controls().Label1.text, u"איכות: 100"_s) << "held within its range";
