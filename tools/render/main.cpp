@@ -12,7 +12,6 @@
 #include <QColor>
 #include <QGuiApplication>
 
-#include <charconv>
 #include <chrono>
 #include <cstdio>
 #include <filesystem>
@@ -133,9 +132,9 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
             if (!request.paper)
                 return refuse("--paper " + *value + " is no paper size; two sides in centimetres are wanted, as 10/15");
         } else if (name == "--size") {
-            const auto [end, error] = std::from_chars(value->data(), value->data() + value->size(), request.cell);
-            if (error != std::errc() || end != value->data() + value->size() || request.cell < 1 ||
-                request.cell > 10000)
+            bool isNumber = false;
+            request.cell = QByteArray::fromStdString(*value).toInt(&isNumber);
+            if (!isNumber || request.cell < 1 || request.cell > 10000)
                 return refuse("--size " + *value + " is no size; 1 to 10000 pixels are wanted");
         } else {
             return refuse("unknown option " + name);

@@ -268,7 +268,7 @@ void applyMatrixToRow(const ColourMatrix& matrix, const std::uint32_t* from, std
     std::array<float, 9> entries{};
     for (int row = 0; row < 3; ++row)
         for (int column = 0; column < 3; ++column)
-            entries[static_cast<std::size_t>(row * 3 + column)] = matrix.entry(row, column);
+            entries[static_cast<std::size_t>(row) * 3 + static_cast<std::size_t>(column)] = matrix.entry(row, column);
     HWY_DYNAMIC_DISPATCH(applyMatrix)(entries.data(), from, to, pixels);
 }
 
