@@ -28,7 +28,7 @@ Failure fail(const QString& text) {
     return {Failure::Kind::Other, text};
 }
 
-// A point of the widget that is really on the window, also when a scroll area cuts it.
+// The middle of the part of the widget that the window shows; a scroll area may hide the rest.
 QPoint middleOf(const QWidget& widget) {
     return widget.visibleRegion().boundingRect().center();
 }
@@ -42,7 +42,7 @@ void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held,
 
 ControlFinder::Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) {
     const QPointer<QWidget> alive(&widget);
-    // A mouse comes from somewhere: what follows it without a press has seen it before the press.
+    // A widget that tracks the mouse sees it move before the press.
     if (widget.hasMouseTracking())
         mouse(widget, at, QEvent::MouseMove, Qt::NoButton, Qt::NoButton);
     if (alive)
@@ -87,7 +87,7 @@ void key(QWidget& widget, int code, const QString& text, Qt::KeyboardModifiers m
     QApplication::sendEvent(&widget, &release);
 }
 
-// The control as the view shows it; where no widget does, as the page holds it.
+// The control as the view registered it; if no widget shows it, as the page holds it.
 Result<PageView::Control> controlIn(const Result<PageView*>& view, const QString& page, const QString& control) {
     if (!view)
         return view.failure();
@@ -115,7 +115,7 @@ Result<const TextList*> listIn(const Result<PageView*>& view, const QString& pag
     return fail(u"%1 has no list %2"_s.arg(page, control));
 }
 
-// What really takes the press: a list or a text area does so by its viewport.
+// The widget that receives the press: of a list or a text area its viewport.
 QWidget& target(QWidget& widget) {
     auto* area = qobject_cast<QAbstractScrollArea*>(&widget);
     return area ? *area->viewport() : widget;
@@ -185,7 +185,7 @@ Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QStri
     const QString why = coveredAt(widget, at);
     if (!why.isEmpty())
         return fail(u"%1.%2 at %3 %4 is %5"_s.arg(page, control).arg(percent.x()).arg(percent.y()).arg(why));
-    // What lies there inside the control takes the press, as it would a person's.
+    // A child widget at that point receives the press, as from a person.
     QWidget* inside = widget.childAt(at);
     QWidget& hit = inside ? *inside : widget;
     return pressDown(hit, hit.mapFrom(&widget, at), button);
@@ -208,7 +208,7 @@ Result<void> ControlFinder::drag(const QString& page, const QString& control, QP
     const Result<QWidget*> found = inSight(page, control);
     if (!found)
         return found.failure();
-    // The control may move under the mouse; the way is the one that it was at the press.
+    // Both ends are taken at the press, since the control may move under the mouse.
     const QPoint begin = (*found)->mapToGlobal(pointOf(**found, from));
     const QPoint end = (*found)->mapToGlobal(pointOf(**found, to));
     Result<Held> held = hold(page, control, from, Qt::LeftButton);
@@ -227,7 +227,7 @@ Result<void> ControlFinder::press(const QString& page, const QString& control) c
     if (!widget)
         return widget.failure();
     QWidget& hit = target(**widget);
-    // A tick box is pressed on its box: its label may be drawn over the whole row.
+    // Of a tick box this is the box itself: its label may be drawn over the whole row.
     click(hit, middleOf(hit));
     return {};
 }
@@ -260,7 +260,7 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
             row = box->findText(text);
         if (row < 0)
             return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
-        // The popup is a window of its own; what follows a press on its row is this.
+        // The popup is a window of its own; these signals follow a press on its row.
         box->setCurrentIndex(row);
         Q_EMIT box->textActivated(box->itemText(row));
         Q_EMIT box->activated(row);
@@ -296,7 +296,7 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
         return fail(u"%1.%2 can't be ticked"_s.arg(page, control));
     if (button->isChecked() != on) {
         const QRect box = button->rect();
-        // Where its mark stands: a tick box answers only on its own contents.
+        // At the tick mark: a tick box reacts only inside its own contents.
         click(*button,
               qobject_cast<QCheckBox*>(button)
                   ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())

@@ -13,49 +13,48 @@ namespace lumora {
 class MainWindow;
 class PageView;
 
-// Controls by their design names ("Command12", "Picture1(3)"), used as a person uses them: an operation fails, and
-// tells why, unless the control is there, visible, enabled and not covered by anything else.
+// Finds controls by their design names ("Command12", "Picture1(3)") and uses them as a person does: each operation
+// fails with a reason unless the control is there, visible, enabled and not covered.
 class ControlFinder {
 public:
     explicit ControlFinder(MainWindow& window)
         : m_window(window) {}
 
-    // The name of the page in front, "" when there is none.
+    // The name of the page in front, "" if there is none.
     QString frontPage() const;
 
-    // Each takes the page's name; a page that is neither in front nor in sight below a panel is a failure.
+    // Each operation takes the page's name and fails if that page is neither in front nor visible below a panel.
     Result<void> press(const QString& page, const QString& control) const;
-    // A mouse that is down on a control, until it is let go. The control may vanish meanwhile.
+    // A mouse button held down on a control, which may vanish before it is released.
     struct Held {
         QPointer<QWidget> widget;
         QPoint at;
         Qt::MouseButton button = Qt::LeftButton;
     };
-    // Places are in percent of the control's width and height.
+    // Points are in per cent of the control's width and height.
     Result<Held> hold(const QString& page, const QString& control) const;
     Result<Held> hold(const QString& page, const QString& control, QPointF percent, Qt::MouseButton button) const;
     void letGo(const Held& held) const;
     Result<void> pressAt(const QString& page, const QString& control, QPointF percent,
                          Qt::MouseButton button = Qt::LeftButton) const;
-    // Moves the mouse in dragMoves equal moves, so that what counts moves comes out the same each time.
+    // Moves the mouse in dragMoves equal steps, so that a control that counts moves gives the same result each time.
     static constexpr int dragMoves = 20;
     Result<void> drag(const QString& page, const QString& control, QPointF from, QPointF to) const;
-    // Replaces what the text box holds.
+    // Replaces the contents of a text box.
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
-    // The row of a list or of a combo box with this text.
+    // Chooses the row with this text in a list or a combo box.
     Result<void> choose(const QString& page, const QString& control, const QString& text) const;
     Result<void> tick(const QString& page, const QString& control, bool on) const;
 
-    // What the page says of the control: its caption, the text of a box, the current row of a list. Also for controls
-    // that are hidden.
+    // What the page holds for a control, hidden ones too: its caption, the text of a box, the current row of a list.
     Result<QString> text(const QString& page, const QString& control) const;
     Result<bool> visible(const QString& page, const QString& control) const;
     Result<bool> enabled(const QString& page, const QString& control) const;
-    // Of lists, also of working lists that nobody sees.
+    // Number of rows of a list; working lists without a widget too.
     Result<int> count(const QString& page, const QString& control) const;
     Result<QString> item(const QString& page, const QString& control, int index) const;
 
-    // Why a mouse press in the middle of the widget would not reach it; empty when it would.
+    // Why a mouse press in the middle of the widget would not reach it; empty if it would.
     static QString whyNotPressable(const QWidget& widget);
 
 private:

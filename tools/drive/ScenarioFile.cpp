@@ -25,8 +25,8 @@ enum class Takes {
     To,
     OptionalRight,
     Word,
-    Text,     // to the end of the line, may be empty
-    SomeText, // the same, but not empty
+    Text,     // rest of the line, may be empty
+    SomeText, // rest of the line, not empty
 };
 
 struct Grammar {
@@ -36,7 +36,7 @@ struct Grammar {
     const char* help;
 };
 
-constexpr double patienceOfPage = 30; // seconds, where the line names none
+constexpr double patienceOfPage = 30; // seconds, if the line names none
 
 const std::array<Grammar, 19>& grammars() {
     static const std::array<Grammar, 19> all{{
@@ -94,7 +94,7 @@ bool isBlank(QChar c) {
     return c == u' ' || c == u'\t';
 }
 
-// "\n" is a line break and "\\" a backslash; a backslash before anything else is itself.
+// Turns "\n" into a line break and "\\" into a backslash; any other backslash stays.
 QString unescaped(const QString& text) {
     QString result;
     for (qsizetype i = 0; i < text.size(); ++i) {
@@ -109,13 +109,13 @@ QString unescaped(const QString& text) {
     return result;
 }
 
-// What is left of a line, taken word by word.
+// The rest of a line, read word by word.
 class Rest {
 public:
     explicit Rest(QString text)
         : m_text(std::move(text)) {}
 
-    // Empty at the end of the line. One blank behind the word goes with it: a text begins right after that.
+    // Empty at the end of the line. The one blank after the word is read too: a text begins right behind it.
     QString word() {
         qsizetype begin = 0;
         while (begin < m_text.size() && isBlank(m_text[begin]))
@@ -154,7 +154,7 @@ QString takePlace(Rest& rest, QPointF& place) {
     return {};
 }
 
-// What is wrong with this argument, or nothing.
+// Reads an argument; gives what is wrong with it, or an empty text.
 QString take(Takes what, Rest& rest, ScenarioCommand& command) {
     if (what == Takes::Text || what == Takes::SomeText) {
         command.text = unescaped(rest.text());

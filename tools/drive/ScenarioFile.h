@@ -32,26 +32,25 @@ enum class ScenarioVerb {
     Pause,
 };
 
-// One command. Which of the fields count is the verb's: see scenarioHelp().
+// One command. scenarioHelp() tells which fields each verb uses.
 struct ScenarioCommand {
-    int line = 0; // of the file, from 1
+    int line = 0; // line of the file, from 1
     ScenarioVerb verb = ScenarioVerb::Page;
     QString page;
     QString control;       // "Command12", "Image1(0)"
-    QString text;          // with its line breaks; also the path of pick and dump and the name of a shot
+    QString text;          // unescaped; also the path of pick and dump, and the name of a shot
     double seconds = 0;    // page, until, pause, hold
     int number = 0;        // expect-count, expect-item
     bool yes = false;      // tick, answer, expect-visible
-    QPointF from, to;      // press-at (from alone), drag: percent of the control's width and height
-    bool rightKey = false; // press-at: of the mouse
+    QPointF from, to;      // press-at (only from), drag: per cent of the control's width and height
+    bool rightKey = false; // press-at: right mouse button
 };
 
-// A text file that says what a customer does at the pages and what must be seen there: one command a line, blank lines
-// and lines that begin with "#" are passed over, as is what follows " #" behind a command that takes no text.
+// A text file of what a customer does on the pages and what must be seen there, one command a line. Blank lines and
+// lines that begin with "#" are skipped, and so is a " #" with what follows, unless the command takes a text.
 class ScenarioFile {
 public:
-    // name is what messages call the file. The failure is of kind Damaged and reads "NAME:LINE: ...", for the first bad
-    // line.
+    // name: the file's name in messages. Fails at the first bad line with kind Damaged and "NAME:LINE: ...".
     static Result<ScenarioFile> parse(const QByteArray& bytes, const QString& name);
     static Result<ScenarioFile> load(const QString& hostPath);
 
@@ -63,7 +62,7 @@ private:
     std::vector<ScenarioCommand> m_commands;
 };
 
-// The commands, a line each, for --help.
+// The commands, one a line, for --help.
 QString scenarioHelp();
 
 } // namespace lumora

@@ -22,8 +22,8 @@ namespace lumora {
 namespace {
 
 constexpr int betweenSteps = 5;         // milliseconds
-constexpr double patienceOfMessage = 5; // seconds: a box may come from a timer of its page
-constexpr double patienceOfWork = 900;  // seconds until work that does not come to rest has failed
+constexpr double patienceOfMessage = 5; // seconds; a timer of the page may show the box
+constexpr double patienceOfWork = 900;  // seconds until work that does not end has failed
 
 bool touches(ScenarioVerb verb) {
     return verb == ScenarioVerb::Press || verb == ScenarioVerb::PressAt || verb == ScenarioVerb::Hold ||
@@ -118,7 +118,7 @@ bool ScenarioPlayer::mayRunNow(ScenarioVerb verb) const {
     }
 }
 
-// The handler behind a control may pump, and then the next lines run inside it: the place moves on before.
+// The handler of the control may pump and so run the next lines; the position moves on before it.
 void ScenarioPlayer::touch(const ScenarioCommand& command) {
     const QString here = place();
     m_goesOnInTheMiddle = false;
@@ -212,7 +212,7 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
     case ScenarioVerb::Type:
     case ScenarioVerb::Choose:
     case ScenarioVerb::Tick:
-        break; // touch() does these
+        break; // done by touch()
     }
     return {};
 }
@@ -222,7 +222,7 @@ ScenarioPlayer::Look ScenarioPlayer::lookForMessage(const QString& wanted) {
     const QString said = QStringLiteral("the message ") + quoted(wanted);
     if (m_messagesTaken >= shown.size())
         return {false, said, QStringLiteral("no message"), patienceOfMessage};
-    // Some of the texts end their lines with a carriage return, which no scenario can write.
+    // Some texts end their lines with a carriage return, which a scenario can't contain.
     QString oldest = shown[m_messagesTaken++];
     oldest.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n');
     return {oldest == wanted, said, quoted(oldest)};

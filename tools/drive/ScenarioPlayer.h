@@ -14,38 +14,36 @@ namespace lumora {
 
 class Program;
 
-// Does at the pages what scenario files say, as a customer would: from the event loop, so that it also sees and stops
-// work that is under way. Before it touches a control it closes the message boxes that are open.
-//
-// A line waits until the work that the lines before it set off has come to rest. Only page, until, pause, shot, dump,
-// pick and answer go on in the middle of such work, and what stands behind a page, until or pause that was fulfilled
-// there follows at once.
+// Plays scenario files on the pages as a customer would, from the event loop, so that it can also watch and stop work
+// that is under way. Before it touches a control it closes all open message boxes.
+// A line waits until the work started by the lines before it has ended. Only page, until, pause, shot, dump, pick and
+// answer run during such work; after a page, until or pause that was fulfilled during it the next line runs at once.
 class ScenarioPlayer : public QObject {
     Q_OBJECT
 public:
-    // shots: the host folder of the pictures.
+    // shots: the folder of the pictures on this machine.
     ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, QString shots);
 
     void start() { m_timer.start(); }
 
-    // To be called when the event loop has ended: lines that are left then fail, since the program is gone.
+    // Called when the event loop has ended: lines that are left fail, since the program has ended.
     void settle() { step(); }
 
-    // Empty while all held; else "FILE:LINE: what was wanted, what was found" of the line that failed.
+    // Empty while all lines held; else "FILE:LINE: what was wanted, what was found" of the failed line.
     const QString& failure() const { return m_failure; }
     bool allHeld() const { return m_finished && m_failure.isEmpty(); }
 
 Q_SIGNALS:
-    // All lines held, or one has failed.
+    // Emitted when all lines held or one failed.
     void finished();
 
 private:
-    // What one line found.
+    // The result of trying a line.
     struct Look {
         bool held = false;
         QString wanted;
         QString found;
-        double patience = 0; // seconds until a line that does not hold has failed
+        double patience = 0; // seconds until a line that does not hold fails
     };
 
     void step();
@@ -80,7 +78,7 @@ private:
     QTimer m_letGo;
     bool m_goesOnInTheMiddle = false;
     bool m_finished = false;
-    qsizetype m_messagesTaken = 0; // of ScreenDialogs::shownTexts
+    qsizetype m_messagesTaken = 0; // index in ScreenDialogs::shownTexts
     QStringList m_picks;           // drive paths
     QList<bool> m_answers;
     QString m_failure;

@@ -19,7 +19,7 @@ int complain(const QString& text, int status) {
     return status;
 }
 
-// An empty size for what is none.
+// An empty size if the text is none.
 QSize sizeIn(const QString& text) {
     const QStringList sides = text.split(u'x');
     if (sides.size() != 2)

@@ -1,4 +1,4 @@
-// The lab's side of a print file, for people who build the lab's tools.
+// Tool for the lab's developers: shows, unpacks and checks print files and order folders.
 
 #include "order/OrderCheck.h"
 #include "order/OrderTail.h"
@@ -39,7 +39,7 @@ Result<PrintFileContent> readFile(const QString& path, PrintFileShape shape) {
 int info(const QStringList& files, PrintFileShape shape) {
     int code = allWell;
     for (const QString& path : files) {
-        // The order sheet lies among the print files under the same ending.
+        // The order sheet has the ending of a print file.
         if (const Result<QByteArray> bytes = readHostFile(toHostPath(path)); bytes && checkWholeJpeg(*bytes)) {
             out() << path << "\n  a plain picture, as an order sheet is: " << bytes->size() << " bytes" << Qt::endl;
             continue;

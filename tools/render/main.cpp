@@ -1,4 +1,4 @@
-// The renderers without an order: for support, and for measuring.
+// Runs the renderers without an order, for support and measurements.
 
 #include "assembly/PaperResize.h"
 #include "common/HostFile.h"
@@ -76,7 +76,7 @@ void complain(const QString& text) {
     complain(std::string_view(text.toUtf8().constData()));
 }
 
-// No value, and the reason told, when the call can't be understood.
+// No value if the arguments are wrong; the reason is printed.
 std::optional<Request> understood(const std::vector<std::string>& arguments) {
     Request request;
     std::string modeName;
@@ -155,7 +155,7 @@ std::optional<Request> understood(const std::vector<std::string>& arguments) {
     return request;
 }
 
-// Customers' pictures are never written over, and no result overwrites another.
+// A result never overwrites a customer's picture or another result.
 bool targetsAreFree(const Request& request, const std::vector<fs::path>& targets) {
     std::map<fs::path, fs::path> sourceOf;
     for (std::size_t i = 0; i < targets.size(); ++i) {
@@ -273,7 +273,7 @@ int main(int argc, char** argv) {
         complain(request->out.string() + " is no folder");
         return notUnderstood;
     }
-    // Fonts come with the application object, and it takes its time to start: only where there is text to draw.
+    // The application object, which loads fonts, starts slowly and is made only if text is drawn.
     std::optional<QGuiApplication> application;
     if (request->isEdited() && request->edit.TextOn == 1) {
         qputenv("QT_QPA_PLATFORM", "offscreen");
@@ -292,7 +292,7 @@ int main(int argc, char** argv) {
             complain(done.failure().message);
             code = pictureFailed;
         } else if (request->time) {
-            // A scaled load is one pass over the file: its decode and its draw can't be told apart.
+            // A scaled load decodes and draws in one pass; the two times can't be told apart.
             if (request->writesPng() && !request->isEdited())
                 std::printf("%s decode and draw %.1f encode %.1f\n", request->files[i].c_str(), times.draw,
                             times.encode);

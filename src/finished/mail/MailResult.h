@@ -6,11 +6,11 @@
 
 namespace lumora {
 
-// The result of a mail step in words for the customer. code is one of the simple mail interface, 0 for success; a code
-// without a meaning of its own gives the last text, and a few give none.
+// What the customer reads after a mail step. code is one of the simple mail interface, 0 for success; an unknown code
+// gives the last text of the table, and a few codes give an empty text.
 QString MailResultText(int code, bool english);
 
-// The code for the end of an exchange; docs/formats.md has the table, from the server's reply onwards.
+// The code for the end of an SMTP exchange; docs/formats.md has the table by the server's reply.
 int MailResultCode(MailEnd end);
 
 } // namespace lumora

@@ -7,7 +7,7 @@ namespace lumora {
 
 namespace {
 
-// A package is done once it has more.
+// A package is over when more minutes than this have passed.
 constexpr double minutesOfPackage = 2;
 
 qint64 wholeMinutes(const QDateTime& time) {
@@ -40,7 +40,8 @@ PackageWalk::Step PackageWalk::step(int inHand, const QDateTime& now) {
 }
 
 void PackageWalk::measure(const QDateTime& now) {
-    // A clock that was set back would hold the package until it has caught up.
+    // If the clock was set back, the minutes begin again; otherwise the package would wait until the clock has caught
+    // up.
     if (now < m_start)
         m_start = now;
     m_minutes = static_cast<double>(MinuteBorders(m_start, now));

@@ -6,32 +6,31 @@
 
 namespace lumora {
 
-// Borders of whole minutes between two times: 10:00:59 and 10:01:00 are one minute apart, 10:00:00 and 10:00:59 none.
-// Negative when the second comes before the first.
+// Number of starts of a minute between two times: 1 from 10:00:59 to 10:01:00, 0 from 10:00:00 to 10:00:59. Negative
+// when to is before from.
 qint64 MinuteBorders(const QDateTime& from, const QDateTime& to);
 
-// A walk over mail packages: its pace, and what has become of each package. A package has more than two minutes by the
-// clock's count of them, so that the next one goes two to three minutes later. Packages count from 0.
+// The pace of the mail packages, and the state of each. The next package begins when more than two starts of a minute
+// have passed, that is, after two to three minutes. Packages count from 0.
 class PackageWalk {
 public:
     void begin(int packages, const QDateTime& now);
-    // The minutes of a package begin.
+    // Starts the minutes of a package.
     void take(const QDateTime& now);
 
-    // What the clock asks for: the next package, or the end when the one in hand is the last. The minutes stand still
-    // at the end.
+    // Whether to wait, to begin the next package, or to end after the last one. The minutes stop at the end.
     enum class Step { Wait, Next, Over };
     Step step(int inHand, const QDateTime& now);
-    // Counts on from the start of the package.
+    // Takes the minutes since the start of the package.
     void measure(const QDateTime& now);
     void clearMinutes() { m_minutes = 0; }
     double minutes() const { return m_minutes; }
-    // Of the way that is behind, 0 to 1.
+    // The part of all packages' time that has passed, 0 to 1.
     double share(int inHand) const;
 
     enum class Fate { Waiting, Sending, Sent, Failed };
     void tell(int package, Fate fate) { m_fates[static_cast<std::size_t>(package)] = fate; }
-    Fate fate(int package) const; // waiting for one that is not there
+    Fate fate(int package) const; // Waiting for a package that does not exist
     int count() const { return static_cast<int>(m_fates.size()); }
     int count(Fate fate) const;
     bool allSent() const { return count() > 0 && count(Fate::Sent) == count(); }

@@ -73,7 +73,7 @@ std::optional<QString> FilesToSend::unmarkedSheet() const {
 QStringList FilesToSend::resendList() const {
     const QString text = OrderFolder(m_folder).logPath();
     QStringList list = markedPaths();
-    // It may be among the marked files, and a name that stands twice in an order never arrives twice.
+    // The log may be marked too; a name that is sent twice never counts as arrived twice.
     list.removeAll(text);
     if (m_files.fileExists(text))
         list.prepend(text);

@@ -9,10 +9,10 @@
 
 namespace lumora {
 
-// The files of one order folder and which of them are marked to be sent. Reading the folder again takes all marks away.
+// The files of one order folder, and which of them are marked for sending. Reading the folder again clears all marks.
 class FilesToSend {
 public:
-    // Whole files: what the lab prints from. Of an order that travels in pieces the list shows pieces and texts too.
+    // The files that the lab prints from. The list of an order in pieces has pieces and texts too.
     static inline const QString wholeFiles = QStringLiteral("*.jpp;*.jpg");
     static inline const QString withPieces = QStringLiteral("*.prk;*.jpp;*.txt");
 
@@ -24,23 +24,23 @@ public:
     void refresh();
 
     const QString& folder() const { return m_folder; }
-    // Leaf names, sorted without regard to case in one order over all patterns.
+    // Leaf names that match any pattern, sorted without regard to case.
     const QStringList& names() const { return m_names; }
     bool isMarked(int index) const;
     int markedCount() const;
 
-    // An index out of range does nothing.
+    // Does nothing with an index out of range.
     void turnMark(int index);
-    // Of an order in pieces only those and the sheet, whose name begins with "!", are marked.
+    // Of an order in pieces it marks only the pieces and the sheet, whose name begins with "!".
     void markAll(Travel Mefurak);
 
-    // Pictures in the marked files, told by the first two characters of each name; texts hold none.
+    // Sum of the copies in the first two characters of the marked names; texts count 0.
     std::int16_t familyCount() const;
 
-    // Full paths of what a new sending takes: the order's text, if there is one, and then the marked files. Empty when
-    // that is nothing, even where a sheet lies there. A sheet that is not marked goes last.
+    // Full paths for a new sending: the order's log, if there is one, the marked files, then a sheet that is not
+    // marked. Empty when there is neither a log nor a marked file.
     QStringList resendList() const;
-    // Full paths of what goes as mail packages, one each: a sheet that is not marked, then the marked files.
+    // Full paths for the mail, one package each: a sheet that is not marked, then the marked files.
     QStringList mailList() const;
 
 private:

@@ -23,10 +23,10 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr int walkTick = 30; // milliseconds
-// A sheet in the preview is shrunk to this many windows, so that half of it is in sight and its text can be read.
+// A sheet is shrunk to this many times the preview window, so that half of it is visible and its text is legible.
 constexpr int previewWindows = 2;
 
-// What each phase but Leaving shows; the page that leaves stays as it is.
+// The controls that each phase shows; Leaving changes nothing.
 constexpr struct {
     Caption MoogMeretControls::*control;
     std::array<bool, 4> in; // Orders, Picked, Walking, Walked
@@ -81,7 +81,7 @@ void MoogMeret::load() {
     for (Caption* label : {&Label23, &Label20, &Label10, &Label7})
         label->text = customer == notChosen ? QString() : customer;
     refreshOrders();
-    // The order that the preparation gives over is the one to be sent.
+    // The order that the preparation hands over is picked.
     if (!handedOver.isEmpty())
         pickOrder(List2.find(FolderOfPath(handedOver.first())));
 }
@@ -103,7 +103,7 @@ bool MoogMeret::mayAct() const {
 
 // --- the orders and their files ---
 
-// The session's order, as the preparation left it.
+// Lists the files of the session's order, as the preparation left it.
 void MoogMeret::listOrderInHand() {
     const QString& folder = m_state.transfer.OrderFolder;
     Label1.text = u"0"_s;
@@ -134,7 +134,7 @@ void MoogMeret::refreshOrders() {
     enter(Phase::Orders);
 }
 
-// The list of files follows the list of folders only when that one moves.
+// Reads the files of the folder only when it is another one than before.
 void MoogMeret::openFolder(const QString& folder) {
     if (std::exchange(Dir1Path, folder) != folder)
         listFiles(folder);
@@ -155,7 +155,7 @@ void MoogMeret::pickOrder(int index) {
     List2.setCurrentIndex(index);
     const QString folder = List2.currentItem();
     m_state.transfer.OrderFolder = folder;
-    // Neither is set back by a later folder: the lab's people may send what an order in pieces came from.
+    // A later folder resets neither: the lab's people may send the print files of an order in pieces.
     if (TravelsInPieces(List3.currentItem())) {
         m_state.transfer.Mefurak = Travel::Pieces;
         m_files.setPattern(FilesToSend::withPieces);
@@ -189,7 +189,7 @@ OrderDetails MoogMeret::detailsOf(const QString& folder) const {
     return details;
 }
 
-// A first file that is no picture, as a print file or a piece, leaves the window empty.
+// The preview stays empty when the first file is no picture, such as a print file or a piece.
 void MoogMeret::loadPreview() {
     Picture1 = {};
     HScroll1 = VScroll1 = {};
@@ -245,7 +245,8 @@ void MoogMeret::ShowFamilyCount() {
 
 // --- the ways on ---
 
-// The list goes to the FTP sender; the HTTP sender takes the order's folder whole, and asks its server what is missing.
+// The FTP sender gets the list of files; the HTTP sender takes the whole folder and asks its server which files are
+// missing.
 void MoogMeret::sendAgain() {
     if (!mayAct() || !Command4.visible)
         return;
@@ -266,7 +267,7 @@ void MoogMeret::sendAgain() {
     m_chain.follow(PageId::MoogMeret, byHttp ? Outcome::ResentByHttp : Outcome::ResentByFtp);
 }
 
-// Both ways of sending are hidden until the box is read.
+// Both buttons of sending are hidden until the box is closed.
 void MoogMeret::tellNothingIsMarked(const QString& words) {
     Command2.visible = Command4.visible = false;
     Q_EMIT changed();

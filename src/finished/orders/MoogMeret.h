@@ -23,31 +23,31 @@ struct MoogMeretControls : Controls {
     QString Dir1Path;                                            // drive path
     TextList List2{*this, u"List2"};                             // full paths of the order folders
     TextList List3{*this, u"List3"};                             // their leaf names
-    Caption Label4Rek{*this, u"Label4Rek", Caption::At::Hidden}; // there is no order at all
-    Caption Label4Bhar{*this, u"Label4Bhar"};                    // none is picked yet
+    Caption Label4Rek{*this, u"Label4Rek", Caption::At::Hidden}; // shown when there is no order
+    Caption Label4Bhar{*this, u"Label4Bhar"};                    // shown when no order is picked
     Caption Command5{*this, u"Command5"};                        // refresh
     Caption Command4Pieces{*this, u"Command4Pieces", Caption::At::Hidden};
 
-    Caption Picture2{*this, u"Picture2", Caption::At::Hidden}; // step two: the files of the order, the yellow window
+    Caption Picture2{*this, u"Picture2", Caption::At::Hidden}; // step two: the files of the picked order
     Caption Label4Shalav2{*this, u"Label4Shalav2"};
     TextList File1{*this, u"File1"};            // leaf names; the current one was touched last
     Caption Label1{*this, u"Label1"};           // files in the order
-    Caption Label5{*this, u"Label5"};           // pictures in the marked files
-    Caption Label4Files{*this, u"Label4Files"}; // what the two numbers count
+    Caption Label5{*this, u"Label5"};           // pictures of the marked files, copies counted
+    Caption Label4Files{*this, u"Label4Files"}; // the units of Label1 and Label5
     Caption Label4Prints{*this, u"Label4Prints"};
-    Caption Label4Pieces{*this, u"Label4Pieces", Caption::At::Hidden}; // only pieces are marked by themselves
-    Caption Label4Reka{*this, u"Label4Reka", Caption::At::Hidden};     // the order has no file to send
+    Caption Label4Pieces{*this, u"Label4Pieces", Caption::At::Hidden}; // "only pieces are marked"
+    Caption Label4Reka{*this, u"Label4Reka", Caption::At::Hidden};     // shown when the order has no file to send
     Caption Command1{*this, u"Command1"};                              // all files
-    Caption Command21{*this, u"Command21"};                            // none
+    Caption Command21{*this, u"Command21"};                            // mark none
     Caption Label23{*this, u"Label23"};                                // the customer's name, at four places
     Caption Label20{*this, u"Label20"};
     Caption Label10{*this, u"Label10"};
     Caption Label7{*this, u"Label7"};
-    Caption Label4Lakoach{*this, u"Label4Lakoach"}; // whose order it is, as its text tells
+    Caption Label4Lakoach{*this, u"Label4Lakoach"}; // the customer named in the order's log
 
     Caption Label4Shalav3{*this, u"Label4Shalav3", Caption::At::Hidden}; // step three
-    // The preview of the order's first file: a window of this size on Picture1, which lies scrollStep pixels further up
-    // and left for each step of the scroll bars.
+    // The preview of the order's first file: a window of this size on Picture1, which moves scrollStep pixels up and
+    // left for each step of the scroll bars.
     static constexpr int previewWidth = 280;
     static constexpr int previewHeight = 210;
     static constexpr int scrollStep = 4;
@@ -58,33 +58,33 @@ struct MoogMeretControls : Controls {
     Bitmap Picture1; // null when the file is no picture
     Scroll HScroll1;
     Scroll VScroll1;
-    Caption Label4Tmuna{*this, u"Label4Tmuna"}; // what the preview is, in spoken words
+    Caption Label4Tmuna{*this, u"Label4Tmuna"}; // spoken description of the preview
     Caption Command4{*this, u"Command4"};       // send again
     Caption Command2{*this, u"Command2"};       // send by mail
     Caption Command6{*this, u"Command6"};       // leave the program
     Caption Command28{*this, u"Command28"};     // new order
     Caption Command4Orders{*this, u"Command4Orders", Caption::At::Hidden};
 
-    TextList List1{*this, u"List1"};            // files to go, full paths; the current one is the package in hand
+    TextList List1{*this, u"List1"};            // files to send, full paths; the current one is the present package
     Caption Label9{*this, u"Label9"};           // "the sending was cut into small parts"
-    Caption Label2{*this, u"Label2"};           // "the pictures are packed and will go in", and how many
+    Caption Label2{*this, u"Label2"};           // "the pictures are packed and will go in" and the count
     Caption Label3{*this, u"Label3"};           // "packages"
-    Caption Label13{*this, u"Label13"};         // minutes on the package in hand
+    Caption Label13{*this, u"Label13"};         // minutes of the present package
     Caption Label4Dakot{*this, u"Label4Dakot"}; // "minutes on this package"
     Caption Label4Shaa{*this, u"Label4Shaa"};   // the time of day
     Caption Label4Mana{*this, u"Label4Mana"};   // "package 2 of 5"
-    Caption Label4Shem{*this, u"Label4Shem"};   // name of the file in hand
-    Caption Label4Doar{*this, u"Label4Doar"};   // what the mail server said of the latest package
-    Caption Label4Sof{*this, u"Label4Sof"};     // what has come of the packages, and where the files are
+    Caption Label4Shem{*this, u"Label4Shem"};   // name of the present package's file
+    Caption Label4Doar{*this, u"Label4Doar"};   // reply of the mail server to the last package
+    Caption Label4Sof{*this, u"Label4Sof"};     // result of the packages, and where the files are
     Caption Label24{*this, u"Label24"};         // "the exit button will work after all the packages"
     Caption Command13{*this, u"Command13", Caption::At::Hidden};
-    Caption Command18{*this, u"Command18"}; // exit, once the walk is over
+    Caption Command18{*this, u"Command18"}; // exit; shown when the walk has ended
     Caption Command19{*this, u"Command19"}; // stop the walk
 };
 
-// The page of finished orders (MoogMeret, "finished"): the customer picks an order that was prepared before and its
-// files, and has them sent again by the order's sender, or by mail in packages, one every few minutes. Nothing of the
-// order is changed, whatever becomes of the sending.
+// The page of finished orders (MoogMeret, "finished"): the customer picks an order prepared earlier and its files, and
+// sends them again by the order's sender, or by mail in packages, one every few minutes. The order's folder never
+// changes.
 class MoogMeret : public Page, private MoogMeretControls {
     Q_OBJECT
 public:
@@ -96,7 +96,7 @@ public:
     // --- events ---
 
     void Command5_Click() { refreshOrders(); }
-    void List3_Click(int index) { pickOrder(index); } // also when it is picked already
+    void List3_Click(int index) { pickOrder(index); } // a click on the picked order picks it again
     void File1_Click(int index) { turnMark(index); }
     void Command1_Click() { markAll(); }
     void Command21_Click() { markNone(); }
@@ -114,7 +114,7 @@ public:
     void Command18_Click() { leaveAfterWalk(); }
     void Command6_Click() { leaveProgram(); }
 
-    // Nobody sees these controls: MoogMeretUnused.cpp.
+    // Events of controls that nobody sees; in MoogMeretUnused.cpp.
     void Command3_Click();
     void Command12_Click();
     void Command13_Click();
@@ -124,29 +124,29 @@ public:
     // --- state ---
 
     enum class Phase {
-        Orders,  // none is picked
-        Picked,  // one is, and its files are marked
-        Walking, // its files go out as mail packages
-        Walked,  // they did, or were stopped; a package that was not sent may be picked again
-        Leaving, // for another page, or the end of the program
+        Orders,  // no order is picked
+        Picked,  // an order is picked and its files are marked
+        Walking, // its files are sent as mail packages
+        Walked,  // the walk has ended; a package that was not sent may be picked again
+        Leaving, // the customer goes to another page or ends the program
     };
     Phase phase() const { return m_phase; }
     const MoogMeretControls& controls() const override { return *this; }
     const FilesToSend& files() const { return m_files; }
-    // An order as a person reads it. Its hint says that it travels in pieces, and is empty where it does not.
+    // An order as the list shows it; hint says that it is in pieces, otherwise it is empty.
     struct OrderRow {
         QString text;
         QString hint;
     };
     OrderRow orderRow(const QString& folderName) const;
     const PackageWalk& walk() const { return m_walk; }
-    // What the mail has brought: Good is what the server has taken, in the walk one package, behind it all of them.
+    // The state of the mail. Good: the server has taken the present package, after the walk all packages.
     enum class Answer { None, Sending, Good, Bad };
     Answer answer() const;
-    int packagesDone() const; // sent; where no mail server is set up, shown
+    int packagesDone() const; // packages sent, or shown if no mail server is set up
     bool clockRuns() const { return Timer3.running(); }
 
-    // What it tells: changed().
+    // The signal is Page::changed().
 
 private:
     void enter(Phase phase);

@@ -1,4 +1,4 @@
-// The wording of the page of finished orders, in both languages.
+// The wording of the page of finished orders.
 #include "common/DrivePathText.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"

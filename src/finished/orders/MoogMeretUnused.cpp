@@ -1,5 +1,4 @@
-// Events of the page of finished orders that stand in the page's description and come from no control that anybody
-// sees. The page's own code calls the verbs.
+// Events of the page of finished orders whose controls nobody sees. The page itself calls the verbs.
 #include "finished/orders/MoogMeret.h"
 
 namespace lumora {

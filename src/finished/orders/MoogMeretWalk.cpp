@@ -1,4 +1,4 @@
-// The walk over the packages of a mail sending.
+// The mail packages of the page of finished orders, sent one after another.
 #include "common/DrivePathText.h"
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
@@ -57,7 +57,7 @@ void MoogMeret::beginWalk() {
     Label4Shaa.text = now.toString(u"HH:mm:ss"_s);
     enter(Phase::Walking);
     selectPackage(0);
-    // The customer may have stopped or left while the message was sent.
+    // The customer may have stopped the walk or left while the package was sent.
     if (m_phase != Phase::Walking)
         return;
     m_walk.take(m_platform.clock.now());
@@ -72,7 +72,7 @@ void MoogMeret::stepWalk() {
     const QString time = now.toString(u"HH:mm:ss"_s);
     if (std::exchange(Label4Shaa.text, time) != time)
         Q_EMIT changed();
-    // Once the walk is over the clock alone goes on.
+    // After the walk only the clock is updated.
     if (m_phase != Phase::Walking)
         return;
     const PackageWalk::Step step = m_walk.step(List1.currentIndex(), now);
@@ -93,7 +93,7 @@ void MoogMeret::stopWalk() {
     endWalk();
 }
 
-// The selection stays where it is.
+// The selected package stays selected.
 void MoogMeret::endWalk() {
     enter(Phase::Walked);
     showOutcome();
@@ -107,7 +107,8 @@ void MoogMeret::clearMinutes() {
 void MoogMeret::pickPackage(int index) {
     if (m_phase != Phase::Walked || sending() || index < 0 || index >= List1.count())
         return;
-    // One that the server has taken is not sent twice; the one in hand is, when it has failed.
+    // A package that the server has taken is not sent again; a click on the present package sends it again if it
+    // failed.
     if (m_walk.fate(index) == PackageWalk::Fate::Sent)
         List1.setCurrentIndex(index);
     else if (index == List1.currentIndex() && m_walk.fate(index) == PackageWalk::Fate::Failed)
@@ -125,7 +126,7 @@ void MoogMeret::selectPackage(int index) {
         sendPackage(index);
 }
 
-// Without a mail server the walk shows each file for its time and sends nothing.
+// Without a mail server nothing is sent: the walk only shows each file for its minutes.
 void MoogMeret::sendPackage(int index) {
     if (!mailSetUp())
         return;

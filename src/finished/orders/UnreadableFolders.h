@@ -7,7 +7,7 @@ namespace lumora {
 class Dialogs;
 struct SessionState;
 
-// Says which folders could not be read, one line each with its reason, as Files::collect gives them; nothing for none.
+// Shows one box with a line for each folder that Files::collect could not read; none for an empty list.
 void TellUnreadableFolders(const SessionState& state, Dialogs& dialogs, const QStringList& unreadable);
 
 } // namespace lumora

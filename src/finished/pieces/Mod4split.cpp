@@ -50,7 +50,7 @@ Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target
     if (!length)
         return refuse(length.failure());
     const qint64 declared = *length / *segment + 1;
-    // Joining finds a number by three digits: pieces with more could never be put together again.
+    // A piece's name has three digits for a number: more pieces could never be joined.
     if (declared > mostPieces)
         return refuse(fault(Failure::Kind::TooLarge, path,
                             QStringLiteral("%1 pieces of %2 bytes; names have room for %3")
@@ -61,7 +61,7 @@ Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target
     const QString total = PieceNumber(cut.declared);
     const QString stem = PieceStem(LeafName(path));
     const QString longest = stem + PieceTail(1, total);
-    // A name that the drive would shorten loses the numbers at its end.
+    // A name that the drive shortens would lose the numbers at its end.
     if (ShortenedName(longest) != longest)
         return refuse(fault(Failure::Kind::Unsupported, path, QStringLiteral("the name is too long for pieces")));
 
@@ -127,7 +127,7 @@ Joined Mod4split::MergeFamily(const QString& piecePath) const {
         return refuse(fault(Failure::Kind::Unsupported, piecePath,
                             QStringLiteral("no piece: the name is shorter than a name and \"_001_001.prk\"")));
     const QString folder = JoinDrivePath(ParentFolder(piecePath), moorkavim);
-    // A family that has gone meanwhile leaves no empty folder.
+    // A family whose pieces were removed meanwhile must not leave an empty folder.
     if (m_files.fileExists(PieceBeside(piecePath, 1))) {
         if (const auto made = m_files.makeFolder(folder); !made)
             return refuse(made.failure());

@@ -56,7 +56,7 @@ QString SpltForm::pickFile() {
     return path;
 }
 
-// A folder that may not be read is told, the others are listed.
+// A folder that can't be read is named in a box; the others are listed.
 QStringList SpltForm::collect(const QString& folder, Files::Depth depth) {
     QStringList unreadable;
     const QStringList files = m_platform.files.collect(folder, depth, &unreadable);
@@ -141,7 +141,7 @@ void SpltForm::cutAll() {
             ++tally.done;
         if (result.pieces > 0)
             where = result.folder;
-        // Every further file would meet the same.
+        // The disk is full: every further file would fail too.
         if (result.failure && result.failure->kind == Failure::Kind::NoSpace)
             break;
     }
@@ -220,7 +220,7 @@ void SpltForm::joinAll() {
         joinTotal(tally), where);
 }
 
-// The chosen family, complete or not.
+// Joins the chosen family, complete or not.
 void SpltForm::joinChosen() {
     const int index = List4Bodedim.currentIndex();
     if (m_phase == Phase::Working || index < 0)
@@ -234,7 +234,8 @@ void SpltForm::joinChosen() {
     }
     QString total = wording(u"%1 צורף. חלקים: %2, בתים: %3."_s, u"%1 was joined. Pieces: %2, bytes: %3."_s)
                         .arg(LeafName(result.file), QString::number(result.pieces), QString::number(result.bytes));
-    // The declared total of an exact multiple is one too many; whether this file is whole no name can tell.
+    // When a file's size is an exact multiple of the piece size, its pieces declare one piece too many. So the names do
+    // not tell whether this file is whole.
     if (result.pieces != result.declared)
         total += wording(u" בשם רשומים %1 חלקים: יש לבדוק שהקובץ שלם."_s,
                          u" The name declares %1: check that the file is whole."_s)
@@ -289,7 +290,7 @@ void SpltForm::end(Phase result, const QString& total, const QString& where) {
         leave();
 }
 
-// In one box, however many files met the same fault.
+// Shows the failures in one box, however many files failed.
 void SpltForm::tellTroubles() {
     constexpr int told = 2;
     if (m_troubles.isEmpty())

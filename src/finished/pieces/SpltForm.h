@@ -14,45 +14,45 @@ struct SessionState;
 struct SpltFormControls : Controls {
     Caption Title{*this, u"Title"};
 
-    Caption Label4Cut{*this, u"Label4Cut"}; // head of what is cut
+    Caption Label4Cut{*this, u"Label4Cut"}; // heading of the files to cut
     Caption Command2{*this, u"Command2"};   // choose the folder of the files to cut
     Caption Label4files{*this, u"Label4files"};
     TextList List4files{*this, u"List4files"}; // files to cut, full paths
     Caption Label4Text2{*this, u"Label4Text2"};
-    Caption Text2{*this, u"Text2"};       // size of a piece in bytes, as it was written
+    Caption Text2{*this, u"Text2"};       // size of a piece in bytes, as typed
     Caption Command3{*this, u"Command3"}; // "Split All"
     Caption Command9{*this, u"Command9"}; // "splitOne"
 
-    Caption Label4Join{*this, u"Label4Join"};     // head of what is joined
-    Caption Command8{*this, u"Command8"};         // reads a folder of pieces
+    Caption Label4Join{*this, u"Label4Join"};     // heading of the pieces to join
+    Caption Command8{*this, u"Command8"};         // read a folder of pieces
     Caption Label1{*this, u"Label1"};             // count of ListChalakim
     Caption Label5{*this, u"Label5"};             // count of List4Bodedim
-    Caption Label4Counts{*this, u"Label4Counts"}; // both in words; empty before a folder was read
+    Caption Label4Counts{*this, u"Label4Counts"}; // both counts in words; empty until a folder is read
     Caption Label4Bodedim{*this, u"Label4Bodedim"};
-    TextList List4Bodedim{*this, u"List4Bodedim"}; // of each family its first listed piece
+    TextList List4Bodedim{*this, u"List4Bodedim"}; // the first listed piece of each family
     Caption Label4Famely{*this, u"Label4Famely"};
-    TextList List4Famely{*this, u"List4Famely"}; // the pieces of the family in hand
+    TextList List4Famely{*this, u"List4Famely"}; // the pieces of the present family
     Caption Label4Chalakim{*this, u"Label4Chalakim"};
-    TextList ListChalakim{*this, u"ListChalakim"};             // every file of the folders read so far, full paths
+    TextList ListChalakim{*this, u"ListChalakim"};             // all files of the folders read so far, full paths
     Caption Label8{*this, u"Label8"};                          // length of the chosen file in bytes
-    Caption Label9{*this, u"Label9"};                          // its drive, "C:"
-    Caption Label4Length{*this, u"Label4Length"};              // both in words; empty before a length was asked for
+    Caption Label9{*this, u"Label9"};                          // drive of the chosen file, "C:"
+    Caption Label4Length{*this, u"Label4Length"};              // length and drive in words; empty until asked for
     Caption Command1{*this, u"Command1"};                      // "MergeAll"
     Caption Command4{*this, u"Command4"};                      // "Merge"
-    Caption Command5{*this, u"Command5", Caption::At::Hidden}; // "Find Famely", without effect
+    Caption Command5{*this, u"Command5", Caption::At::Hidden}; // "Find Famely"; has no effect
     Caption Command6{*this, u"Command6"};                      // "Filelen"
 
     Caption Label4Idle{*this, u"Label4Idle"};   // what the page is for
-    Caption Label4Work{*this, u"Label4Work"};   // what is in hand
-    Caption Label4Total{*this, u"Label4Total"}; // what came of it
-    Caption Label4Where{*this, u"Label4Where"}; // the folder where the result lies
+    Caption Label4Work{*this, u"Label4Work"};   // what the present work does
+    Caption Label4Total{*this, u"Label4Total"}; // result of the work
+    Caption Label4Where{*this, u"Label4Where"}; // folder of the result
     Caption Command15{*this, u"Command15"};     // stop
     Caption Image3{*this, u"Image3"};           // back
 };
 
-// The page of pieces (SpltForm, Mod4split): the lab's operator cuts the files of a folder into pieces that a slow line
-// can carry, and joins families of pieces into the file again. It works on any folder, reads what it is given and
-// writes beside it. Long work yields between two pieces, and can be stopped there.
+// The page of pieces (SpltForm, Mod4split): the lab's operator cuts the files of a folder into pieces for a slow
+// connection, and joins families of pieces into files again. It works on any folder and writes beside the sources. Long
+// work pumps events after each piece and can be stopped there.
 class SpltForm : public Page, private SpltFormControls {
     Q_OBJECT
 public:
@@ -73,15 +73,15 @@ public:
     void List4Bodedim_Click(int index) { chooseFamily(index); }
     void ListChalakim_Click(int index) { choosePiece(index); }
     void Command15_Click() { m_stop = true; }
-    void Image3_Click() { goBack(); } // work under way ends first
+    void Image3_Click() { goBack(); } // stops the work first
 
     // --- state ---
 
-    enum class Phase { Idle, Working, Good, Partly, Failed }; // the last three: what came of the work
+    enum class Phase { Idle, Working, Good, Partly, Failed }; // the last three are results
     Phase phase() const { return m_phase; }
     const SpltFormControls& controls() const override { return *this; }
-    int percent() const { return m_percent; } // of the work in hand
-    // An entry of List4Bodedim as a person reads it.
+    int percent() const { return m_percent; } // of the present work
+    // An entry of List4Bodedim as the list shows it.
     struct FamilyRow {
         QString name;
         QString words;
@@ -89,10 +89,10 @@ public:
     };
     FamilyRow familyRow(int index) const;
 
-    // What it tells: changed().
+    // The signal is Page::changed().
 
 private:
-    // What came of the files or families of one piece of work.
+    // Counts over the files or families of one run of the work.
     struct Tally {
         int done = 0;
         int pieces = 0;
@@ -138,14 +138,14 @@ private:
     const Platform& m_platform;
     PageChain& m_chain;
     Mod4split m_pieces;
-    std::vector<PieceFamily> m_families; // of List4Bodedim
+    std::vector<PieceFamily> m_families; // one for each entry of List4Bodedim
     std::vector<Fate> m_fates;
     Phase m_phase = Phase::Idle;
-    QString m_folder; // where the last file was picked
-    int m_index = 0;  // of the file or family in hand
+    QString m_folder; // folder of the last picked file
+    int m_index = 0;  // index of the present file or family
     int m_count = 0;
     int m_percent = 0;
-    QStringList m_troubles; // of the work in hand
+    QStringList m_troubles; // failures of the present work
     bool m_stop = false;
     bool m_leaving = false;
 };

@@ -1,4 +1,4 @@
-// The wording of the page of pieces, in both languages.
+// The wording of the page of pieces.
 #include "common/DrivePathText.h"
 #include "finished/pieces/SpltForm.h"
 #include "order/PieceName.h"
@@ -48,7 +48,7 @@ void SpltForm::showCounts() {
     if (!Label1.text.isEmpty())
         Label4Counts.text =
             wording(u"קבצים: %1 · משפחות: %2"_s, u"Files: %1 · families: %2"_s).arg(Label1.text, Label5.text);
-    // The marks keep the drive's colon behind its letter.
+    // The isolating marks keep the drive's colon behind its letter in Hebrew text.
     Label4Length.text = Label8.text.isEmpty()
                             ? QString()
                             : wording(u"%1 בתים, כונן \u2066%2\u2069"_s, u"%1 bytes, drive \u2066%2\u2069"_s)

@@ -9,22 +9,22 @@ namespace lumora {
 
 class EventPump;
 
-// What the customer asks for while a sending runs. The rules look at it between their steps.
+// What the customer asks for during a sending. The rules read it between their steps.
 struct SendingStop {
-    // The customer has left the page or the program: every loop ends at its next step and nothing more is sent.
+    // The customer has left the page or the program: every loop ends at its next step, and nothing more is sent.
     bool left = false;
-    // The customer has asked to stop. Read at the head of each file and within it, between two tries to reach the
-    // server, and behind a check; reset where a file begins.
+    // The customer has pressed stop. It is read before and during each file, between two tries to connect, and after a
+    // check; it is reset where a file begins.
     bool StopFlag = false;
 };
 
-// The only pause of the senders: rounds of telling and pumping, no clock.
+// The only pause of the senders: rounds of telling and pumping, without a clock.
 void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const SendingStop& stop);
 
-// Up to so many attempts at one order, each a pass over what is missing and a check of what has arrived.
+// Up to a number of attempts at one order; each sends the missing files and then checks which have arrived.
 class Attempts {
 public:
-    // What the sending has come to; no value when the customer has left.
+    // The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> run(int attempts, SendingMoment beginning = SendingMoment::AttemptBegins);
 
 protected:
@@ -33,9 +33,9 @@ protected:
         , m_stop(stop) {}
     ~Attempts() = default;
 
-    // False if the customer has stopped it.
+    // False when the customer has stopped the sending.
     virtual bool sendMissing(int attempt) = 0;
-    // The end, or no value when another attempt is due.
+    // The end of the sending, or no value when another attempt is needed.
     virtual std::optional<SendingPhase> checkArrival(int attempt) = 0;
     virtual SendingPhase afterTheLast() = 0;
 

@@ -8,16 +8,15 @@ namespace lumora {
 
 struct SessionState;
 
-// Which step of the transfer failed.
-// File: a file of the order can't be read or named, so that it never came to the line. Confirm: the line held, and yet
-// the server's list does not say that all has arrived. KeepList: that list could not be stored on this machine.
+// The step of the transfer that failed. File: a file of the order can't be read or its name can't be sent. Confirm: the
+// connection held, but the server's list does not confirm that all files arrived. KeepList: the server's list could not
+// be written on this machine.
 enum class LineStep { Open, Connect, OrderFolder, File, Put, List, Confirm, KeepList };
 
-// What a failure of the line means for the customer, in the language of the session. subject is the file's name where a
-// file is concerned.
+// What a failure of the transfer means for the customer. subject is the file's name, if the step is about a file.
 QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject = {});
 
-// The number under which the makers know a failure of the line; 12003 stands for an answer of the server itself.
+// The error number shown for a failure of the transfer; 12003: the server itself refused.
 int LineErrorNumber(Failure::Kind kind);
 
 } // namespace lumora

@@ -6,7 +6,7 @@ namespace lumora {
 
 QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject) {
     const bool answered = failure.kind == Failure::Kind::Refused || failure.kind == Failure::Kind::AccessDenied;
-    // Names are kept apart from the sentence around them, which may run the other way.
+    // Isolating marks: the name may run in the other direction than the sentence.
     const QString name = QChar(0x2068) + subject + QChar(0x2069);
     switch (step) {
     case LineStep::Open:

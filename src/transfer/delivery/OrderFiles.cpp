@@ -12,7 +12,7 @@ namespace lumora {
 
 namespace {
 
-// A folder's path of fewer characters is none.
+// A shorter path is no folder.
 constexpr int shortestFolder = 4;
 
 } // namespace

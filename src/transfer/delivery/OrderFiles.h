@@ -8,16 +8,15 @@ namespace lumora {
 class Files;
 class OrderFolder;
 
-// The files of a folder as FTP sends them: the order log first, then the print files, or the sheet and the pieces of an
-// order that travels in pieces. Without a sheet such an order has the folder itself in its place, whose put fails.
-// entries: the folder's names that match the sending page's pattern.
+// The files of a folder in the order in which FTP sends them: the order log, then the print files. Of an order in
+// pieces the sheet and the pieces follow the log; without a sheet the folder itself stands in its place, and its put
+// fails. entries: the folder's names that match the sending page's pattern.
 QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QStringList& entries, bool inPieces);
 
-// The same of the lines that the page of finished orders has handed over, for the older bulk path.
+// The same for the older bulk path, chosen from the paths that the page of finished orders handed over.
 QStringList BulkFiles(const QStringList& handedOver, bool inPieces);
 
-// The files of a folder as HTTP sends them: all but serverList, the list that an earlier check has fetched into it and
-// that the server never names.
+// The files of a folder that HTTP sends: all but serverList, the file that an earlier check downloaded into the folder.
 QStringList HttpOrderFiles(const Files& files, const QString& folder, const QString& serverList);
 
 } // namespace lumora

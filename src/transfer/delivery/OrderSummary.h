@@ -9,10 +9,10 @@ namespace lumora {
 
 struct SessionState;
 
-// The lines of an order's summary: date, who, delivery, paper, remarks, total, and four empty lines below.
+// The lines of an order's summary: date, customer, delivery, paper, remarks, total, then four empty lines.
 QStringList OrderSummaryLines(const SessionState& state, const QDate& date);
 
-// The same as a small picture, which travels with the order as its last file.
+// The lines as a small picture, the last file of the order.
 Bitmap OrderSummaryPicture(const QStringList& lines, Qt::LayoutDirection direction);
 
 } // namespace lumora

@@ -8,10 +8,10 @@
 
 namespace lumora {
 
-// A moment of a sending that needs no more than a number to be told.
+// What happens during a sending and needs at most a number to tell.
 enum class SendingMoment {
     AttemptBegins, // number: the attempt, from 1
-    RoundBegins,   // the same of the older bulk path
+    RoundBegins,   // number: the round of the older bulk path, from 1
     RoundFailed,   // number: the round
     CheckBegins,
     CheckEnds,
@@ -19,61 +19,61 @@ enum class SendingMoment {
     PassEnds,
     Incomplete, // number: files missing
     NothingToSend,
-    Stopped, // the customer's stop has been followed
+    Stopped, // the sending has stopped, as the customer asked
 
-    // The way to the lab's folder.
+    // On the way to the lab's folder.
     SessionOpen,
     SessionClosed,
     Opening,      // number: the try
-    NoInternet,   // number: tries and one
+    NoInternet,   // number: tries plus one
     Connecting,   // number: the try
     NotConnected, // number: tries
     Connected,
     FolderFound,
     InsideServer,
     FolderMissing,
-    WalkStep,  // one of the four steps of the walk is done
-    NoSession, // a folder is to be entered without a session; told once a pass
+    WalkStep,  // one of the four steps to the lab's folder is done
+    NoSession, // a folder is entered without a session; told once a pass
     NoDirectory,
     CutOff,
     OutsideFolder,
-    Continuing, // the order's folder is there already
+    Continuing, // the order's folder exists on the server
     Ready,
 
-    // A file.
+    // For each file.
     Reaching,  // its session begins
-    Unreached, // the lab's folder was not found; the file is left out
+    Unreached, // the lab's folder was not found; the file is not sent
     WalkDone,
-    Skipped,  // the server has it already
-    FileDone, // number: its place, from 1
+    Skipped,  // the server has the file
+    FileDone, // number: position of the file, from 1
     Posted,   // number: files left
 
-    // What the server holds.
-    Listed,  // number: files, before the dots are taken out
+    // About the files on the server.
+    Listed,  // number: files, "." and ".." included
     Counted, // number: files
     CheckingBroken,
     Missing,  // number: files missing
-    Answered, // the server's texts have changed
+    Answered, // the server's answers have changed
 };
 
-// What the rules of a sending tell while they work. They know no page: what is shown, and in which words, is decided by
-// who hears it.
+// What the rules of a sending tell while they work. The rules know no page; the page that listens decides what is shown
+// and in which words.
 class SendingEvents {
 public:
     virtual void reached(SendingMoment moment, int number = 0) = 0;
-    // The pass has come to the file at index.
+    // The pass has reached the file at index.
     virtual void progressed(int index, int count) = 0;
-    // The file at index is put on the line.
+    // The file at index is being sent.
     virtual void sending(int index, int count, const QString& name) = 0;
-    // share: 0 to 1 of the pieces of the order; minutes: left, where the pace is known.
+    // share: part of the order's pieces that is sent, 0 to 1. minutes: minutes left, if the pace is known.
     virtual void pieceSent(double share, std::optional<int> minutes) = 0;
-    // subject: the file's name where a file is concerned.
+    // subject: the file's name, if the step is about a file.
     virtual void failed(LineStep step, const Failure& failure, const QString& subject = {}) = 0;
-    // The list of broken files could not be written.
     virtual void brokenNotKept(const Failure& failure) = 0;
-    // The remote directory at the lab's first or second folder level, as the server tells it and without its slash.
+    // level: 1 or 2, the lab's folder level that was entered. asTold: the current directory as the server tells it;
+    // withoutSlash: the same without its leading slash.
     virtual void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) = 0;
-    // One round of a pause, counted from 1.
+    // round: of a pause, from 1.
     virtual void pausing(int round) = 0;
 
 protected:

@@ -27,7 +27,7 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
         if (page == this)
             QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
     });
-    // The window may be closed, and the page unloaded, while a sending runs inside a pump: it must not go on unseen.
+    // The window may be closed or the page unloaded inside a pump of a sending, which must not go on unseen.
     connect(&chain, &PageChain::ended, this, [this] { leave(); });
     connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
         if (page == this)
@@ -35,7 +35,7 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
     });
 }
 
-// Inside the pump of a page that still hands over, clicks would not get through to this one.
+// While the page before still runs a pump, clicks would not reach this page.
 void SendingPage::activateWhenFree() {
     if (m_platform.pump.pumping())
         QTimer::singleShot(whileAPumpRuns, this, &SendingPage::activateWhenFree);
@@ -80,7 +80,7 @@ SendingGauge SendingPage::gauge() const {
         return {sign, m_countdown.share(), QString::number(m_countdown.seconds()), wording(u"שניות", u"seconds")};
     case SendingSign::Percent:
         return {sign, m_shown.percent / 100.0, QStringLiteral("%1%").arg(m_shown.percent), wording(u"נשלחו", u"sent")};
-    case SendingSign::Asking: // behind a pass the ring stays full
+    case SendingSign::Asking: // after a pass the ring stays full
         return {sign, m_phase == SendingPhase::Checking ? 1.0 : 0.0, QStringLiteral("…"),
                 wording(u"בודקים", u"checking")};
     default:
@@ -100,7 +100,7 @@ void SendingPage::forgetReason() {
     m_shown.Label4Reason.visible = false;
 }
 
-// An order that has not gone stays in its folder and is found among the finished ones.
+// The order stays in its folder and is listed among the finished ones.
 void SendingPage::leaveForNewOrder() {
     m_chain.follow(id(), Outcome::NewOrderWanted);
 }

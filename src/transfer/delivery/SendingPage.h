@@ -12,7 +12,7 @@ class PageChain;
 struct Platform;
 struct SessionState;
 
-// What the gauge says: a sign, or how much of the ring is filled and the two texts within it.
+// What the gauge shows: a sign, or a ring filled by share with two texts inside.
 struct SendingGauge {
     SendingSign sign;
     double share = 0; // 0 to 1
@@ -20,12 +20,12 @@ struct SendingGauge {
     QString small;
 };
 
-// What the two sending pages have in common: the phase, the table that says how each phase looks, the countdown, and
-// the ways in and out. A page acts once it is in front, so that what it does is seen; made alone it sends nothing.
+// What the two sending pages have in common: the phase and its look, the countdown, the ways in and out. A page begins
+// when it comes to the front, so that the customer sees what it does; construction alone sends nothing.
 class SendingPage : public Page {
     Q_OBJECT
 public:
-    void Form_Activate(); // the page has come up
+    void Form_Activate(); // the page has come to the front
 
     SendingPhase phase() const { return m_phase; }
     const PhaseLook& look() const { return lookOf(m_phase); }
@@ -37,19 +37,19 @@ protected:
     SendingPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain, SendingControls& shown,
                 Countdown countdown);
 
-    // The page's table by phase.
+    // The row of the page's table for the phase.
     virtual const PhaseLook& lookOf(SendingPhase phase) const = 0;
-    // The advice of a row, its numbers filled in.
+    // The advice of the row with its numbers inserted.
     virtual QString advice(const PhaseLook& row) const;
-    // What else the phase changes.
+    // Changes the page's own controls with the phase.
     virtual void showPhase(const PhaseLook& row) = 0;
-    // The page begins by itself.
+    // Starts what the page does by itself.
     virtual void begin() = 0;
-    // The customer leaves the page or the program: nothing more is sent.
+    // The customer leaves the page or the program: nothing more may be sent.
     virtual void leave() = 0;
 
     void enter(SendingPhase phase);
-    // The phase in the language of the session.
+    // Shows the texts of the phase in the language of the session.
     void tellPhase();
     void tellReason(LineStep step, const Failure& failure, const QString& subject);
     void forgetReason();

@@ -5,19 +5,19 @@
 
 namespace lumora {
 
-// Where a sending stands. One set for both senders; the FTP sender alone ends in Unclear and Stopped.
+// The phase of a sending, for both senders. Only the FTP sender ends in Unclear or Stopped.
 enum class SendingPhase {
-    Preparing, // the order is read; by HTTP the server is asked what it has of it already
-    NoOrder,   // there is nothing to send
-    NoServer,  // the lab has named no server
-    Countdown, // the sending begins by itself when the count ends
+    Preparing, // the order is read; the HTTP sender asks which files the server has
+    NoOrder,   // the order has no files
+    NoServer,  // the profile names no server
+    Countdown, // the sending begins when the count ends
     Waiting,   // the customer has stopped the count
     Sending,
-    Checking,  // the server is asked what has arrived
-    Reporting, // all has arrived, and the lab's site is told
+    Checking,  // the server is asked which files have arrived
+    Reporting, // all files have arrived; the lab's site is told
     Success,
-    AllThere, // every file of the order is on the server, and nothing was reported
-    Unclear,  // the server's list gives no verdict
+    AllThere, // all files are on the server; no report was sent
+    Unclear,  // the server's list gives no clear answer
     NotAll,   // files are missing after the last attempt
     Stopped,  // the customer has stopped the sending
 };
@@ -29,14 +29,13 @@ constexpr bool hasArrived(SendingPhase phase) {
     return phase == SendingPhase::Success || phase == SendingPhase::AllThere;
 }
 
-// What the gauge of a sending page shows.
 enum class SendingSign { Seconds, Percent, Asking, Good, Held, Unclear, Bad };
 
 enum class SendingButton {
     None = 0,
     SendNow = 1,
     SendAgain = 2,
-    Hold = 4, // stops the count; by FTP it starts it again too
+    Hold = 4, // stops the count; by FTP a second press starts it again
     GoOn = 8,
     Stop = 16,
     NewOrder = 32,
@@ -51,14 +50,14 @@ struct SendingWords {
     const char16_t* english;
 };
 
-// One row of a sending page's table: all that the page and its view show of a phase.
+// A row of a sending page's table: what page and view show of a phase.
 struct PhaseLook {
     SendingPhase phase;
     SendingSign sign;
-    SendingButton main; // has the keyboard; None: nothing is to be chosen
+    SendingButton main; // has the focus; None if there is no choice
     SendingButtons buttons;
     SendingWords title;
-    SendingWords advice; // what the customer can do now
+    SendingWords advice; // what the customer can do
 };
 
 } // namespace lumora

@@ -6,13 +6,13 @@
 
 namespace lumora {
 
-// How far a pass over count files is when the file at index begins: Int(index / max(count - 1, 1) * 100).
+// Per cent of a pass over count files when the file at index begins: Int(index / max(count - 1, 1) * 100).
 int UploadPercent(int index, int count);
 
-// Width of the inner bar: Int(percent * full / 100).
+// Width of the inner bar in a bar of the width full: Int(percent * full / 100).
 int BarWidth(int percent, int full);
 
-// The place of a piece in its order, as its name tells.
+// The number and total of a piece, as its name tells.
 struct PieceOfOrder {
     QString sequence;
     QString total;
@@ -21,7 +21,7 @@ struct PieceOfOrder {
 };
 std::optional<PieceOfOrder> PieceFromName(const QString& name);
 
-// Minutes left, from the seconds that the last piece took: truncated, plus 3 for the check that follows.
+// Minutes left, from the seconds of the last piece: whole minutes, plus 3 for the check.
 int MinutesLeft(qint64 secondsOfOne, int remaining);
 
 } // namespace lumora

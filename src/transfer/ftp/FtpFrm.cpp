@@ -16,7 +16,7 @@ const QString filesToSend = QStringLiteral("*.gbr;*.jpp;*.prk");
 constexpr int countdownTick = 1000;
 constexpr int blinkTick = 500;
 constexpr int countdownFrom = 15;
-// The count is over as its last second begins.
+// The count ends when its last second begins.
 constexpr int countdownEnd = 1;
 constexpr int secondsAfterFailure = 10;
 
@@ -61,7 +61,7 @@ bool FtpFrm::inPieces() const {
     return m_state.transfer.Mefurak == Travel::Pieces;
 }
 
-// Inside a sending, before the order is listed and once it has arrived the start controls do nothing.
+// The start controls do nothing during a sending, before the order is listed and after all has arrived.
 bool FtpFrm::canSend() const {
     return !isUnderWay(phase()) && !hasArrived(phase()) && phase() != SendingPhase::Preparing && !m_sender.stop.left;
 }
@@ -161,7 +161,7 @@ void FtpFrm::stopSending() {
     m_sender.stop.StopFlag = true;
     Command15.enabled = Command21.enabled = false;
     const QString stopping = wording(u"נעצר לאחר הקובץ הנוכחי", u"Stopping after the present file");
-    Label4Do.text = stopping; // the status line goes on with what happens meanwhile
+    Label4Do.text = stopping; // the status line will change with the next event
     status(stopping);
 }
 
@@ -169,7 +169,7 @@ void FtpFrm::showFailure() {
     Label2.visible = true;
     Label9.visible = true;
     Image6.visible = true;
-    Label4Reason.visible = false; // said in Label2
+    Label4Reason.visible = false; // Label2 says the same
     Label2.text = Label4Reason.text.isEmpty()
                       ? wording(u"חלק מהקבצים לא הגיעו לשרת.", u"Some of the files did not arrive at the server.")
                       : Label4Reason.text;
@@ -200,7 +200,7 @@ void FtpFrm::succeed() {
     percent = 100;
     PicInProgWidth = Pic4ProgWidth;
     LabelProg.text = QStringLiteral("100  %");
-    Picture7.visible = false; // its warning no longer holds
+    Picture7.visible = false; // nothing is left to warn about
 }
 
 void FtpFrm::finish(SendingPhase end) {
@@ -208,7 +208,7 @@ void FtpFrm::finish(SendingPhase end) {
         succeed();
     pageSize = PageSize::Full;
     Label4File.text.clear();
-    Label34.visible = !hasArrived(end); // nothing is missing, in whichever attempt it came
+    Label34.visible = !hasArrived(end); // after success the number of attempts is of no interest
     Picture1.visible = false;
     File1Enabled.enabled = end != SendingPhase::Success;
     if (end == SendingPhase::NotAll) {
@@ -221,7 +221,7 @@ void FtpFrm::finish(SendingPhase end) {
 void FtpFrm::leave() {
     m_sender.stop.left = true;
     stopTimers();
-    // A pass that is under way may stand in a call of the session; it closes at its next step.
+    // During a pass the session may be inside a call; the pass closes it at its next step.
     if (!isUnderWay(phase()))
         m_sender.session.closeSession();
 }
@@ -238,7 +238,7 @@ void FtpFrm::close() {
 
 void FtpFrm::stay() {
     Picture7.visible = false;
-    // After a stop or a failure nothing goes out until the customer says so.
+    // After a stop or a failure only the customer starts the sending.
     if (phase() == SendingPhase::Countdown || phase() == SendingPhase::Waiting)
         startCount();
     Q_EMIT changed();

@@ -7,10 +7,10 @@
 
 namespace lumora {
 
-// FtpFrm, "sending an order by FTP" in the glossary: the customer waits here while one finished order folder goes to
-// the lab's server. The page lists its files, counts down, sends, and goes round again for what has not arrived, four
-// times in all. Success sends the two reports. A stop or a failure leaves the local folder as it is, so that the order
-// can be sent again.
+// FtpFrm, "sending an order by FTP" in the glossary: the customer waits while one order folder is sent to the lab's
+// server. The page lists the files, counts down, sends, and tries again what has not arrived, four times in all. After
+// success it sends the two reports. After a stop or a failure the local folder is unchanged, so that the order can be
+// sent again.
 class FtpFrm : public SendingPage, private FtpFrmControls, private SendingEvents {
     Q_OBJECT
 public:
@@ -51,7 +51,7 @@ public:
     void Command19_Click() { sendChain(); }
     void Command25_Click() { checkChosenOrder(); } // BdikaAfterUploadB
 
-    // Events that no control sends; FtpFrmUnused.cpp.
+    // Events that no control sends; in FtpFrmUnused.cpp.
     void Command26_Click() { showProof(); }
     void Command27_Click();
     void Command3_Click();
@@ -66,10 +66,10 @@ public:
     void File1_Click(int index);
     void List2_Click(int index);
     void ListRezefFiles_Click(int index);
-    void takeChain(const QStringList& folderNames); // into ListRezefFiles
-    // Makes a resend of a folder from File1 itself, as the finished-orders page does.
+    void takeChain(const QStringList& folderNames); // fills ListRezefFiles
+    // Prepares a resend of a folder from File1, as the page of finished orders does.
     void PrepareResendHere(const QString& folder);
-    // Shows number, server's reply and a question whether to close.
+    // Shows the error number and the server's reply, and asks whether to close the session.
     void FtpFatalErrorAsk(const Failure& failure, const QString& source);
 
     // State.
@@ -163,8 +163,8 @@ private:
     Ticker Timer1; // 1000 ms: the countdown
     Ticker Timer2; // 500 ms: the blinking
     FtpSender m_sender;
-    QStringList m_handedOver; // the lines that the finished-orders page gave
-    // Asked for by Command26, set by no page.
+    QStringList m_handedOver; // paths from the page of finished orders
+    // Command26 shows the proof picture if a page has set both; none does.
     bool m_proofWanted = false;
     QString m_proofText;
 };

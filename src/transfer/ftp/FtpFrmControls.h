@@ -6,37 +6,37 @@
 
 namespace lumora {
 
-// What the page that sends by FTP shows.
+// The controls of the page that sends by FTP.
 struct FtpFrmControls : SendingControls {
     enum class PageSize {
         Full,
-        Small, // while files travel the page is a narrow strip, so that the customer's screen is free
+        Small, // a narrow strip while files are sent, so that the customer can use the screen
     };
     PageSize pageSize = PageSize::Full;
-    std::int16_t AllDone = 0; // 1 after success; read by the close button
+    std::int16_t AllDone = 0; // 1 after success
 
-    // Label3 is the status line in the system's own words; Label4Do says the same to a person who never saw this page.
+    // Label3 is the status line in the system's terms; Label4Do tells the same to a customer.
     Caption Label3{*this, u"Label3"};
     Caption Label46{*this, u"Label46"};                                // name of the order folder
     Caption Label7{*this, u"Label7"};                                  // number of files found in the folder
     Caption Label21{*this, u"Label21"};                                // pictures in all, copies counted
-    Caption Label4Counts{*this, u"Label4Counts"};                      // both in a sentence
-    Caption Label4Prints{*this, u"Label4Prints"};                      // the pictures in a sentence
+    Caption Label4Counts{*this, u"Label4Counts"};                      // pictures and files in a sentence
+    Caption Label4Prints{*this, u"Label4Prints"};                      // pictures in a sentence
     Caption Label15{*this, u"Label15", Caption::At::Hidden};           // home delivery note
     Caption Label4Ktovet{*this, u"Label4Ktovet", Caption::At::Hidden}; // the delivery address
-    Caption Label4Summary{*this, u"Label4Summary"};                    // head of the summary
-    Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary: shown at success and kept
-    QStringList Picture2Lines;                                         // as a small picture
+    Caption Label4Summary{*this, u"Label4Summary"};                    // heading of the summary
+    Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary, shown at success
+    QStringList Picture2Lines;                                         // its lines; saved as a small picture
     Caption Picture13{*this, u"Picture13", Caption::At::Hidden};       // the proof picture
     QString Picture13File;                                             // drive path
 
-    // The countdown's seconds stand at both places. Image10 and Image11 blink against each other meanwhile.
+    // Label33 and Label20 both show the seconds of the countdown; Image10 and Image11 blink in turn.
     Caption Label33{*this, u"Label33"};
     Caption Label20{*this, u"Label20"};
     Caption Image10{*this, u"Image10"};
     Caption Image11{*this, u"Image11", Caption::At::Hidden};
 
-    // Progress over the files of the pass.
+    // Progress of the pass.
     static constexpr int Pic4ProgWidth = 1000;
     Caption LabelProg{*this, u"LabelProg"}; // "42  %"
     Caption Pic4Prog{*this, u"Pic4Prog", Caption::At::Hidden};
@@ -44,18 +44,18 @@ struct FtpFrmControls : SendingControls {
     Caption PicInProgKatan{*this, u"PicInProgKatan", Caption::At::Hidden};
     int PicInProgKatanWidth = 0;                                             // pieces sent, 0 to Pic4ProgWidth
     Caption Label4Diff{*this, u"Label4Diff", Caption::At::Hidden};           // estimated minutes left
-    Caption Label4DiffTitle{*this, u"Label4DiffTitle", Caption::At::Hidden}; // what they are
+    Caption Label4DiffTitle{*this, u"Label4DiffTitle", Caption::At::Hidden}; // their heading
     Caption Label4Minutes{*this, u"Label4Minutes", Caption::At::Hidden};     // their unit
-    Caption Picture1{*this, u"Picture1", Caption::At::Hidden};               // the bar that runs in each pause
+    Caption Picture1{*this, u"Picture1", Caption::At::Hidden};               // the bar that moves in each pause
     int Picture1Width = 0;                                                   // 0 to 266
-    Caption Label34{*this, u"Label34"};                                      // which attempt
+    Caption Label34{*this, u"Label34"};                                      // number of the attempt
     Caption Label4siem{*this, u"Label4siem"};                                // position in a chain of orders
 
-    // The panel "not all arrived"; Picture6 says its five parts in one sentence.
+    // The panel "not all arrived"; Picture6 joins its five parts to a sentence.
     Caption Picture6{*this, u"Picture6", Caption::At::Hidden};
     Caption Label4Nichshal{*this, u"Label4Nichshal"};      // "the computer failed to upload "
-    Caption Label31{*this, u"Label31"};                    // the count of a list that nothing fills
-    Caption Label4Missing{*this, u"Label4Missing"};        // the true number of missing files
+    Caption Label31{*this, u"Label31"};                    // the count of List9, which nothing fills
+    Caption Label4Missing{*this, u"Label4Missing"};        // number of missing files
     Caption Label4Mitoch{*this, u"Label4Mitoch"};          // "files out of "
     Caption Label12{*this, u"Label12"};                    // files meant for sending
     Caption Label4Yooadoo{*this, u"Label4Yooadoo"};        // " files meant for sending "
@@ -63,8 +63,8 @@ struct FtpFrmControls : SendingControls {
     Caption Label2{*this, u"Label2", Caption::At::Hidden}; // what went wrong
     Caption Label9{*this, u"Label9", Caption::At::Hidden}; // where the order is kept
     Caption Image6{*this, u"Image6", Caption::At::Hidden}; // sign of the panel
-    Caption Frame9{*this, u"Frame9", Caption::At::Hidden}; // older bulk path: which round failed
-    Caption Label4{*this, u"Label4"};                      // its round number
+    Caption Frame9{*this, u"Frame9", Caption::At::Hidden}; // older bulk path: the failed round
+    Caption Label4{*this, u"Label4"};                      // its number
 
     // "Close although nothing was sent?"
     Caption Picture7{*this, u"Picture7", Caption::At::Hidden}; // its text
@@ -76,9 +76,9 @@ struct FtpFrmControls : SendingControls {
     Caption Command10{*this, u"Command10", Caption::At::Hidden}; // send again
     Caption Command15{*this, u"Command15", Caption::At::Greyed}; // stop
     Caption Command21{*this, u"Command21", Caption::At::Greyed}; // stop
-    Caption Command23{*this, u"Command23"};                      // stop the countdown, go on
+    Caption Command23{*this, u"Command23"};                      // stop the countdown or go on
     Caption Command18{*this, u"Command18"};                      // stop the countdown
-    Caption Command11{*this, u"Command11", Caption::At::Greyed}; // exit, once all has arrived
+    Caption Command11{*this, u"Command11", Caption::At::Greyed}; // exit, after all has arrived
     Caption Command8{*this, u"Command8"};                        // exit
     Caption Command22{*this, u"Command22"};                      // "press here in case of a communication fault"
     Caption Command24{*this, u"Command24"};                      // show Frame2
@@ -88,11 +88,11 @@ struct FtpFrmControls : SendingControls {
     Caption Frame5{*this, u"Frame5"};
     Caption Label6{*this, u"Label6"};
     Caption Label8{*this, u"Label8"};
-    Caption Pic4Quik{*this, u"Pic4Quik", Caption::At::Hidden}; // nothing shows it
+    Caption Pic4Quik{*this, u"Pic4Quik", Caption::At::Hidden}; // never visible
 
     // The lab's own area: the lists and the manual panel.
     Caption Frame2{*this, u"Frame2", Caption::At::Hidden};
-    Caption Label4ToSend{*this, u"Label4ToSend"}; // heads of List3, List6, List7 and LogList
+    Caption Label4ToSend{*this, u"Label4ToSend"}; // headings of List3, List6, List7 and LogList
     Caption Label4OnServer{*this, u"Label4OnServer"};
     Caption Label4Failed{*this, u"Label4Failed"};
     Caption Label4Log{*this, u"Label4Log"};
@@ -112,7 +112,7 @@ struct FtpFrmControls : SendingControls {
     int File1Index = -1;                // chosen entry of File1
     Caption Label5{*this, u"Label5"};   // remote directory asked for
     Caption Label37{*this, u"Label37"}; // remote directory at the first level, as the server tells it
-    Caption Label38{*this, u"Label38"}; // and without its slash
+    Caption Label38{*this, u"Label38"}; // the same without the leading slash
     Caption Label40{*this, u"Label40"}; // the same at the second level
     Caption Label41{*this, u"Label41"};
     CheckCaption chkPassive{*this, u"chkPassive"};

@@ -1,4 +1,4 @@
-// What the rules of the sending tell, put into the words and controls of the page.
+// Shows the events of a sending by FTP in the page's controls and words.
 #include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
@@ -13,8 +13,8 @@ namespace lumora {
 
 namespace {
 
-// A line of the status line: the words of a moment, and where its number stands. An order that travels in pieces keeps
-// the status line quiet where it would change with every piece.
+// The status line of a moment: its words, and on which side its number stands. With WholeFiles an order in pieces
+// leaves the status line unchanged, since it would change with every piece.
 struct StatusLine {
     enum class Number { None, First, Last };
     enum class Told { Always, WholeFiles };

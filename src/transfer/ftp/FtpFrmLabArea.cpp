@@ -12,7 +12,7 @@ namespace lumora {
 void FtpFrm::refillAndSendInRounds() {
     if (isUnderWay(phase()) || AllDone == 1)
         return;
-    // The proof picture alone would arrive and count as the whole order.
+    // List3 would get the proof picture alone, and its arrival would count as that of the order.
     if (m_handedOver.isEmpty()) {
         m_platform.dialogs.message(QStringLiteral("list3 is empty"));
         return;

@@ -1,4 +1,4 @@
-// What the page sends: the files of a new order or of a resend, in the order in which they travel.
+// Lists the files that the page sends, for a new order or for a resend.
 #include "common/DrivePathText.h"
 #include "editing/editor/gdisave.h"
 #include "order/BrokenFiles.h"

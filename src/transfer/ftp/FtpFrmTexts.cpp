@@ -1,4 +1,4 @@
-// All wordings of the page that sends by FTP but those of its status line, which stand beside its events.
+// The wording of the page that sends by FTP; that of its status line stands in FtpFrmEvents.cpp.
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/CaptionTexts.h"
@@ -78,7 +78,7 @@ constexpr std::array looks{
               {u"ההזמנה נשלחה", u"Your order was sent"},
               {u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
                u"The whole order has arrived. You can close, or begin a new order."}},
-    // %1: files on the server, %2: files of the order; in the next row too.
+    // %1: files on the server, %2: files of the order; likewise in the next row.
     PhaseLook{SendingPhase::AllThere,
               SendingSign::Good,
               NewOrder,
@@ -138,7 +138,6 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Command15.visible = row.buttons.testFlag(Stop);
     Image5.visible = row.buttons.testFlag(SendNow);
     Command23.visible = row.buttons.testFlag(Hold);
-    // The order stays in its folder, so that what is missing can be sent.
     Command10.visible = row.buttons.testFlag(SendAgain);
     Command11.visible = Command11.enabled = row.buttons.testFlag(Close);
     Command23.text =

@@ -1,5 +1,5 @@
-// Events and routines of the sending page that no control of the program calls: the lab's manual panel, the resend from
-// the page's own file list, and the question behind a fatal error. They stay for the lab's own tests.
+// Events and routines of the page that no control calls: the lab's manual panel, the resend from the page's own file
+// list, and the question after a fatal error. The lab's own tests use them.
 #include "common/DrivePathText.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
@@ -81,8 +81,8 @@ void FtpFrm::cmdClosehOpen_Click() {
     Q_EMIT changed();
 }
 
-// Both options store the same transfer type: the lab's server takes every file, pictures too, as ASCII with its bytes
-// unchanged.
+// Both buttons set the same transfer type: the lab's server takes all files, pictures too, as ASCII and keeps their
+// bytes.
 void FtpFrm::optBin_Click() {
     m_sender.session.dwType = 1;
     optBin.checked = true;

@@ -7,21 +7,21 @@
 
 namespace lumora {
 
-// The working lists of the FTP sender, under the names that the lab's people know.
+// The working lists of the FTP sender, under the names that the lab's people use.
 struct FtpLists {
     TextList List1;          // names in the FTP home directory
     TextList List2;          // names after a make-dir or a manual operation
     TextList List3;          // full local paths of the files of the present pass
-    TextList List4;          // names inside the first remote folder
-    TextList List5;          // names inside the second: the order folders on the server
-    TextList List6;          // names inside the order's folder on the server
-    TextList List7;          // every path whose put failed
-    TextList List8;          // leaf names used to count pictures
-    TextList List9;          // shown as a count and never filled
-    TextList List4Makor;     // the whole order; never shrinks
-    TextList List4Broken;    // full local paths whose put failed and whose remains must leave the server
+    TextList List4;          // names in the first remote folder
+    TextList List5;          // names in the second remote folder: the order folders
+    TextList List6;          // names in the order's folder on the server
+    TextList List7;          // all paths whose put failed
+    TextList List8;          // leaf names for counting the pictures
+    TextList List9;          // never filled; its count is shown
+    TextList List4Makor;     // all files of the order
+    TextList List4Broken;    // full local paths whose put failed; their remains on the server must be deleted
     TextList List4BrokenB;   // working copy of their leaf names
-    TextList LogList;        // time-stamped lines of trouble
+    TextList LogList;        // failures with the time
     TextList ListRezefFiles; // order folders of a chain; no page fills it
     TextList List4Tikiyot;   // folders of Command27; no page fills it
 

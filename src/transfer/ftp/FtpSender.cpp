@@ -29,7 +29,7 @@ private:
         }
         compare(attempt);
         const bool arrived = m_sender.allCounted();
-        // A stop cuts the check short; what it still saw itself counts.
+        // After a stop the count is valid only if this check has read the server's folder itself.
         if (m_stop.StopFlag && !(arrived && m_sender.check.freshCount)) {
             if (!m_stop.left)
                 m_sender.pass.endStopped();
@@ -45,12 +45,12 @@ private:
         return std::nullopt;
     }
 
-    // Afterwards List3 holds what is missing, unless the server holds too many names.
+    // Leaves the missing files in List3, unless the server holds more names than the order has files.
     void compare(int attempt) {
         m_sender.check.check(attempt);
         if (m_sender.check.NumOnServer >= m_sender.NumToSend || m_stop.left)
             return;
-        // A second look, since the first may have failed and counted an older listing.
+        // The check may have failed and counted an older listing.
         m_sender.check.ListServerFiles();
         if (m_sender.check.NumOnServer < m_sender.NumToSend)
             m_sender.check.RebuildMissing();

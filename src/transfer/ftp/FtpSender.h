@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-// Sends one order by FTP. Who begins an order puts its files into List3 and says with beginOrder() that they are whole.
+// Sends one order by FTP. The caller puts the files into List3, then calls beginOrder().
 class FtpSender {
 public:
     static constexpr int attempts = 4;
@@ -13,22 +13,22 @@ public:
 
     FtpSender(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events);
 
-    // Nothing of an earlier order is left in the lists.
+    // Removes all that belongs to an earlier order.
     void clearLists();
-    // What List3 holds is the whole order.
+    // Takes List3 as the whole order.
     void beginOrder();
     std::int16_t countList3() const;
-    // List3 is the whole order again; what has arrived is skipped on the way.
+    // Puts the whole order into List3 again; the pass skips what has arrived.
     void refill();
 
-    // Up to four attempts, each a pass and a check. What the sending has come to; no value when the customer has left.
+    // Up to four attempts, each a pass and a check. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> RunAttempts();
-    // The older bulk path: up to three rounds over List3, each ended by a look at the server.
+    // The older bulk path: up to three rounds over List3, each followed by a check.
     std::optional<SendingPhase> runOlderRounds();
 
-    // The last check counted as many files as the order has.
+    // True when the last check counted as many files as the order has.
     bool allCounted() const { return check.NumOnServer == NumToSend; }
-    // The end where the counts differ and there is nothing to send again.
+    // The end when nothing is left to send but the counts differ.
     SendingPhase silentEnd() const;
 
     FtpLists lists;

@@ -218,7 +218,7 @@ bool FtpSession::EnterOrderFolder() {
         tell(SendingMoment::Ready);
         return true;
     }
-    // What another folder held must not make a file of this one pass for sent.
+    // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
     FtpMakeOrderDir(name);
     pump();
@@ -300,8 +300,7 @@ void FtpSession::take(const std::vector<FtpEntry>& entries) {
         colNames.append(entry.name);
         colAttrs.push_back(entry.folder ? folderAttribute : plainAttribute);
     }
-    // The find record is taken without a look at the handle, so that an empty directory leaves one empty name. The
-    // counts of the verification know it so.
+    // An empty directory gives one empty name, and the counts of the check rely on it.
     if (entries.empty()) {
         colNames.append(QString());
         colAttrs.push_back(0);

@@ -15,85 +15,83 @@ namespace lumora {
 
 struct Platform;
 
-// One FTP session with the lab's server: opens it, connects, walks down to the lab's folders, makes the order's folder,
-// puts, lists, deletes. It never decides what to send. Each call blocks; between calls events are pumped.
-//
-// Closed, then open (hOpen), connected (bActiveSession), in the order's folder, and closed again: the sender runs this
-// cycle once for each file and once for each check, so that a broken line never costs more than the file in hand.
+// One FTP session with the lab's server: opens, connects, enters the lab's folders, makes the order's folder, puts,
+// lists, deletes. It does not decide what to send. Each call blocks; events are pumped between calls.
+// Its states: closed, open (hOpen), connected (bActiveSession), in the order's folder. The sender runs through them
+// once for each file and once for each check, so that a broken connection costs at most the present file.
 class FtpSession {
 public:
     FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events,
                SendingStop& stop, FtpLists& lists);
 
-    // A pass begins: its counters, and each trouble that is told once a pass may be told again.
+    // Begins a pass: resets its counters, and failures that are told once a pass may be told again.
     void beginPass();
 
-    // Host, user and password from the client profile.
+    // Takes host, user and password from the client profile.
     void takeSettings();
 
     void FtpOpenInternet();
     void FtpConnectServer();
     void EnterFolderTK1();
     void EnterFolderTK2();
-    // The four above with their pauses. FolderOk tells whether the lab's folder was found.
+    // The four steps above with their pauses. FolderOk: the lab's folder was found.
     void walkToLabFolder();
 
-    // True if the walk has ended where order folders lie.
+    // True when the current directory is the one of the order folders.
     bool insideOrderBase() const;
-    // Enters the order's folder, or makes it. False if it could not be entered: nothing must be put then.
+    // Enters the order's folder and makes it if it is missing. False on failure: nothing may be put then.
     bool EnterOrderFolder();
-    // Enters an order's folder that the listing of the base showed, and lists it into List6. False if that failed;
-    // List6 stays then.
+    // Enters an order's folder that List5 names and reads its names into List6. False on failure, with List6 unchanged.
     bool enterListedFolder(const QString& name);
     bool inOrderFolder() const { return m_inOrderFolder; }
     void FtpMakeOrderDir(const QString& name);
 
-    // One put. False if it failed, which LogList, List7 and List4Broken then tell; nothing happens without a session.
+    // Puts one file. A failed put is added to LogList, List7 and List4Broken. False without a session, too.
     bool FtpSendFile(const QString& path);
-    // kashloo.txt as List4Broken is now. A write that fails is told once a pass.
+    // Writes List4Broken to kashloo.txt. A failed write is told once a pass.
     void keepBrokenFiles();
-    // The answer is not examined: deleting what is not there is normal here.
+    // Errors are ignored: the file is often not there.
     void remove(const QString& remoteName);
 
-    // Listings into colNames and colAttrs. An empty directory gives one empty name; a listing that fails gives none and
-    // ends the session.
+    // Read a directory into colNames and colAttrs. An empty directory gives one empty name; on failure both are empty
+    // and the session is closed.
     void ListRemote(const QString& dir);
     void ListRemoteHere();
     void ListRemoteChecked();
     enum class Target { List1, List2, List4, List5, List6 };
     void FillListFromNames(Target target, const QString& dir);
 
-    void FtpCloseConnection(); // the connection alone
+    void FtpCloseConnection(); // closes the connection and keeps the session
     void FtpCloseAll();
-    void closeSession(); // both
+    void closeSession(); // closes connection and session
     QString CurrentRemoteDir();
     void PauseBar(int times = 1);
 
-    // The manual panel: in the current remote directory. A failure ends the session.
+    // The manual panel, in the current remote directory. A failure closes the session.
     void putHere(const QString& path);
     void getHere(const QString& remoteName, const QString& localFolder);
     void removeHere(const QString& remoteName);
     void makeGoop();
 
-    // The server's own words at a refusal, fetched into LastResponse.
+    // Reads the server's reply to the failed command into LastResponse.
     void takeResponse(const Failure& failure);
-    // A line of LogList: hour and minute without a separator and without padding, then the text.
+    // Adds a line to LogList: hour and minute without separator and padding, then text.
     void log(const QString& text);
 
     bool hOpen = false;
     std::unique_ptr<FtpConnection> hConnection;
     bool bActiveSession = false;
-    bool passive = true; // the server's side opens the data channel
-    int dwType = 1;      // transfer type ASCII; no other value ever reaches it
+    bool passive = true; // passive mode: the client opens the data connection
+    int dwType = 1;      // transfer type ASCII; no other value is ever set
     QStringList colNames;
     std::vector<int> colAttrs; // 16 for a folder
     bool FolderOk = false;
     std::int16_t ConnectFails = 0;
     std::int16_t RoundNo = 0;
     QString FtpHost, FtpUser, FtpPass;
-    QString MikumBaSharat;   // remote current directory without its leading slash
-    QString RemoteDirectory; // the directory that was last asked for
-    QString LastResponse;    // the server's own words at the last refusal
+    QString MikumBaSharat;   // current remote directory without its leading slash
+    QString RemoteDirectory; // last directory asked for
+    QString LastResponse;    // the server's reply to the last refused command
 
 private:
     void tell(SendingMoment moment, int number = 0) { m_events.reached(moment, number); }
@@ -114,13 +112,12 @@ private:
     SendingStop& m_stop;
     FtpLists& m_lists;
     bool m_inOrderFolder = false;
-    // A pass opens a session for each file; these troubles are told once.
+    // Each file of a pass opens a session; these failures are told once a pass.
     bool m_noInternetTold = false;
     bool m_noSessionTold = false;
     bool m_notKeptTold = false;
 };
 
-// True when the profile names a host, a user and a password.
 bool CheckFtpSettings(const ClientProfile& profile);
 
 } // namespace lumora

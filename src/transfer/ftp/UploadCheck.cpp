@@ -25,7 +25,7 @@ const std::vector<Step>& stepsOf(int attempt) {
     return attempt == 1 ? first : attempt == 4 ? last : middle;
 }
 
-// Removing while walking skips the entry behind the one removed, so that the list is walked this often.
+// Removing an entry skips the next one, so that one walk may leave dots; three walks remove all.
 constexpr int filterWalks = 3;
 
 } // namespace
@@ -69,7 +69,6 @@ void UploadCheck::freshConnection() {
 
 bool UploadCheck::lookUp() {
     const QString& name = m_transfer.ShemTikiya;
-    // One folder of that name can be entered, however often the listing has it.
     return m_lists.List5.contains(name) && m_session.enterListedFolder(name);
 }
 
@@ -128,7 +127,7 @@ void UploadCheck::RecheckBroken() {
 }
 
 void UploadCheck::DeleteBrokenFiles() {
-    // Outside the order's folder a file of the same name belongs to somebody else.
+    // In another folder a file of the same name belongs to another order.
     if (nothingBroken() || !m_session.inOrderFolder())
         return;
     m_session.CurrentRemoteDir();
@@ -146,7 +145,7 @@ void UploadCheck::DeleteBrokenFiles() {
 }
 
 void UploadCheck::ConfirmBrokenGone() {
-    // A listing from before the failed put would not show its remains.
+    // Only a listing made after the failed put shows its remains.
     if (nothingBroken() || !m_freshListing)
         return;
     m_session.PauseBar();

@@ -4,9 +4,9 @@
 
 namespace lumora {
 
-// After each pass the check reconnects from scratch, deletes the remains of failed puts from the server and counts the
-// names in the order's folder. An order counts as sent when its folder on the server holds as many names as the order
-// has files; neither sizes nor dates are compared.
+// The check after each pass: it reconnects, deletes the remains of failed puts from the server and counts the names in
+// the order's folder. An order counts as sent when that folder holds as many names as the order has files; sizes and
+// dates are not compared.
 class UploadCheck {
 public:
     UploadCheck(const TransferState& transfer, EventPump& pump, SendingEvents& events, SendingStop& stop,
@@ -18,7 +18,7 @@ public:
         , m_lists(lists)
         , m_session(session) {}
 
-    // The steps that follow the pass of an attempt, 1 to 4. They differ in their pauses and closings alone.
+    // The steps of the check after attempt 1 to 4; they differ only in pauses and in closing the connection.
     void check(int attempt);
 
     void ListServerFiles();
@@ -27,15 +27,15 @@ public:
     void ConfirmBrokenGone();
     void RebuildMissing();
 
-    // Takes out of List3 what List6 has already.
+    // Removes from List3 what List6 names.
     void DropAlreadySent();
 
-    // Files of the order that are not on the server, or only as the remains of a failed put.
+    // Files of the order that are not on the server, or there only as the remains of a failed put.
     QStringList missing() const;
 
-    // Names in List6 less those whose put failed: they are on the server, but not as sent files.
+    // Names in List6 without the remains of failed puts.
     std::int16_t NumOnServer = 0;
-    bool freshCount = false; // the last ListServerFiles saw the order's folder; else its count is that of older lists
+    bool freshCount = false; // the last ListServerFiles has read the order's folder; else NumOnServer is older
 
 private:
     bool lookUp();
@@ -50,7 +50,7 @@ private:
     SendingStop& m_stop;
     FtpLists& m_lists;
     FtpSession& m_session;
-    bool m_freshListing = false; // List6 was read by the last RecheckBroken
+    bool m_freshListing = false; // the last RecheckBroken has read List6
 };
 
 } // namespace lumora

@@ -12,7 +12,7 @@ void UploadPass::run() {
     m_events.reached(SendingMoment::PassBegins);
     m_session.beginPass();
     m_stop.StopFlag = false;
-    // The pause since an earlier pass is no pace of the line.
+    // The time since the last piece of an earlier pass tells nothing about the pace.
     LastPartTime = {};
     for (int i = 0; i < m_lists.List3.count() && !m_stop.StopFlag && !m_stop.left; ++i) {
         m_events.progressed(i, m_lists.List3.count());
@@ -88,8 +88,8 @@ void UploadPass::send(const QString& path) {
     if (onServer && !remains) {
         m_events.reached(SendingMoment::Skipped);
     } else {
-        // A server may still hold the file that a cut line left open; it takes the name again once the remains are
-        // gone.
+        // The server may still hold open the file of a broken connection; it accepts the name again after the remains
+        // are deleted.
         if (remains)
             m_session.remove(name);
         put(path, name);

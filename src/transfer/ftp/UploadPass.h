@@ -6,7 +6,7 @@
 
 namespace lumora {
 
-// One walk over List3: each file on a session of its own, names that are on the server already skipped.
+// One pass over List3: each file in a session of its own; files that the server has are skipped.
 class UploadPass {
 public:
     UploadPass(const Platform& platform, SendingEvents& events, SendingStop& stop, FtpLists& lists, FtpSession& session)
@@ -17,16 +17,16 @@ public:
         , m_session(session) {}
 
     void run();
-    // The file at an index of List3.
+    // index: of List3.
     void UploadOneFile(int index);
-    // A stop has been followed: the session is closed and the stop told.
+    // Ends a stopped pass: closes the session and tells the stop.
     void endStopped();
 
     std::int16_t UserStopped = 0;
     int CurrentIndex = -1;     // index in List3
-    int BrokenBefore = 0;      // size of List4Broken before a send
-    QDateTime LastPartTime;    // when the last piece had gone
-    bool FaultPressed = false; // read by nobody
+    int BrokenBefore = 0;      // size of List4Broken before a put
+    QDateTime LastPartTime;    // when the last piece was sent
+    bool FaultPressed = false; // no page reads it
 
 private:
     void tellPiece(int index);

@@ -18,7 +18,7 @@ namespace lumora {
 namespace {
 
 constexpr int httpPauseRounds = 1801;
-// A list is some lines of names; what is larger is none.
+// A larger file is no list.
 constexpr qint64 largestList = 4 * 1024 * 1024;
 const QString testFolder = QStringLiteral("tttt");
 
@@ -58,8 +58,8 @@ void HttpSender::tellMissing() {
 }
 
 std::optional<SendingPhase> HttpSender::HttpAttempts() {
-    // One cell serves as the number of the list file and as the count of what is missing: behind a first attempt that
-    // missed more than three files there is no list of that number, and the whole order goes again.
+    // m_listNumber is the number of the next list file and also the count of missing files: after an attempt that
+    // missed more than three there is no such list file, and the whole order is sent again.
     m_listNumber = 1;
     m_listFailure = {};
     return run(attempts);
@@ -100,7 +100,7 @@ void HttpSender::post(const QString& path) {
 std::optional<SendingPhase> HttpSender::checkArrival(int) {
     findMissing(m_listNumber);
     m_listNumber = lists.List4Hossarim.count();
-    // A file that stayed behind says more than the list that lacks it.
+    // A failed post explains more than the list that lacks the file.
     if (m_allPosted && !lists.List4Hossarim.isEmpty() && !m_stop.left)
         m_events.failed(listTrouble(), m_listFailure);
     m_events.reached(SendingMoment::CheckEnds);
@@ -109,7 +109,7 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
     return std::nullopt;
 }
 
-// Why a check found files missing although each was posted.
+// The step that failed when a check finds files missing although all were posted.
 LineStep HttpSender::listTrouble() const {
     if (m_listFailure.message.isEmpty())
         return LineStep::Confirm;
@@ -153,8 +153,8 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     readListInOrder();
     const ServerAnswer answer = ReadServerAnswer(lists.TxtWeb, name);
     lists.ListAfterWeb.append(answer.entries);
-    // What is named counts as arrived even in a list without a total, but such a list is not believed: the whole order
-    // goes again.
+    // Files named in a list without a total count as arrived, but that list is not trusted: the whole order is sent
+    // again.
     if (answer.namesFolder) {
         const QStringList missing = MarkHossarim(lists.List4Kvazim.items(), lists.ListAfterWeb.items(), name);
         lists.List4Hossarim.clear();
@@ -191,7 +191,7 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
 void HttpSender::downloadList(int listNumber) {
     const Files& files = m_platform.files;
     clsDownload download(m_platform);
-    // The list of an earlier check would pass for the answer of this one.
+    // A list from an earlier check must not be read as the answer to this one.
     const QString list = OrderFolder::chosen(m_state).filePath(ListFileName(0));
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)

@@ -12,10 +12,10 @@ namespace lumora {
 
 struct SessionState;
 
-// The working lists and texts of the HTTP sender, under the names that the lab's people know.
+// The working lists and texts of the HTTP sender, under the names that the lab's people use.
 struct HttpLists {
-    TextList List4Kvazim;                                          // every file of the order folder, full paths
-    TextList List4Hossarim;                                        // the files still missing, full paths
+    TextList List4Kvazim;                                          // all files of the order folder, full paths
+    TextList List4Hossarim;                                        // missing files, full paths
     TextList ListAfterWeb;                                         // entries of the last listing
     TextList ListInOrder;                                          // entries of the list file
     QString TxtWeb;                                                // the last answer, or the list file's text
@@ -30,33 +30,33 @@ struct HttpLists {
     }
 };
 
-// Sends one order by HTTP, file by file, and asks scripts on the lab's web server which files arrived. The answer to an
-// upload is never taken for success, only the server's list is.
+// Sends one order by HTTP, file by file, and asks scripts on the lab's web server which files have arrived. Only the
+// server's list tells success, never the answer to an upload.
 class HttpSender final : private Attempts {
 public:
     static constexpr int attempts = 3;
 
     HttpSender(SessionState& state, const Platform& platform, SendingEvents& events);
 
-    // List4Kvazim: the files of the order's folder; none when no folder is named.
+    // Fills List4Kvazim with the files of the order's folder; empty when no folder is set.
     void BuildOrderFileList();
-    // What the server has of the order, into List4Hossarim; all is missing where its list can't be believed.
+    // Fills List4Hossarim with the files that the server lacks; with all files when its list can't be trusted.
     void findMissing(int listNumber);
-    // The server's own word. listNumber: which of its list files is fetched, 0 to 3; any other fetches none.
+    // Asks the server. listNumber: the list file to download, 0 to 3; none for any other number.
     ServerVerdict CheckOrderOnServer(int listNumber);
     void HttpFetchFileListN(int listNumber);
-    // ListInOrder as the list file says.
+    // Fills ListInOrder from the list file.
     void readListInOrder();
 
-    // Up to three attempts at what is missing. What the sending has come to; no value when the customer has left.
+    // Up to three attempts. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> HttpAttempts();
 
-    // The answers are not looked at: the order is on the server already.
+    // The answers of both calls are ignored: the order is on the server.
     void HttpSendReport() const;
     void HttpSendDone() const;
     void HttpPause(int times = 1);
 
-    // The lab's own tests of its scripts; the answers go to TxtWeb.
+    // The lab's tests of its scripts; the answers are in TxtWeb.
     void postTestPicture();
     void postNothing();
     void fetchTestListing();
@@ -81,9 +81,9 @@ private:
     const Platform& m_platform;
     UploadScript m_script;
     int m_listNumber = 1;
-    int m_left = 0;          // files of the pass that have not been posted
-    bool m_allPosted = true; // of the last pass
-    Failure m_listFailure;   // of the last list file that was asked for; no message when it was fetched
+    int m_left = 0;          // files of the pass not yet posted
+    bool m_allPosted = true; // every file of the last pass was posted
+    Failure m_listFailure;   // failure of the last list file's download; no message after success
 };
 
 } // namespace lumora

@@ -5,31 +5,31 @@
 
 namespace lumora {
 
-// The entries of a listing that the lab's scripts write: names parted by "~~", the folder's own name and "total:" with
-// a number among them. A text of 35 characters or fewer is an answer and no listing: it has no entries.
+// The entries of a listing by the lab's scripts: names separated by "~~", among them the folder's name and "total:"
+// with a number. A text of at most 35 characters is no listing and has no entries.
 QStringList ParseServerList(const QString& text);
 
-// The files of the order that a listing does not name. A file counts as arrived when its name contains an entry, letter
-// case aside: a short entry thus takes a longer name with it. The folder's own name and the total name no file and are
-// passed over, or the folder's name would take the order's log, which begins with it. files are full paths.
+// The files of the order that a listing lacks, as full paths. A file has arrived when its name contains an entry,
+// regardless of case, so that a short entry also stands for a longer name. The folder's name and the total are skipped:
+// the log's name begins with the folder's name.
 QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName);
 
-// What a check of the server said of an order.
+// The result of a check of the server.
 enum class ServerVerdict : int {
-    OtherFolder = -1, // the first file lies elsewhere than in the order's folder
-    NotVerified = 0,  // no list of this folder, or one without a total
+    OtherFolder = -1, // the first file does not lie in the order's folder
+    NotVerified = 0,  // no list of the folder, or one without a total
     Listed = 1,
 };
 
-// What an answer says of a folder.
+// What an answer of the server tells about a folder.
 struct ServerAnswer {
-    ServerVerdict verdict = ServerVerdict::NotVerified; // Listed: the list names the folder and carries a total
-    QStringList entries;                                // none where the answer says that the folder is unknown
-    bool namesFolder = false; // with or without a total; the number behind the total is compared with nothing
+    ServerVerdict verdict = ServerVerdict::NotVerified; // Listed: the list names the folder and has a total
+    QStringList entries;                                // empty when the folder is unknown to the server
+    bool namesFolder = false;                           // with or without a total, whose number is not compared
 };
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName);
 
-// The list file of a number on the server: 0 to 3; any other has none and gives an empty name.
+// The name of the server's list file 0 to 3; empty for any other number.
 QString ListFileName(int number);
 
 } // namespace lumora

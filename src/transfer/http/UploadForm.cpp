@@ -14,7 +14,7 @@ constexpr int panelTick = 1;
 constexpr int httpSecond = 1000;
 constexpr int panelStep = 6;
 constexpr int httpCountFrom = 5;
-// The count is over a second behind its nought.
+// The count ends one second after it shows 0.
 constexpr int httpCountEnd = 0;
 
 } // namespace

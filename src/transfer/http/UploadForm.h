@@ -6,19 +6,19 @@
 
 namespace lumora {
 
-// What the page that sends by HTTP shows.
+// The controls of the page that sends by HTTP.
 struct UploadFormControls : SendingControls {
     Caption TxtWeb{*this, u"TxtWeb"};         // the last answer, or the list file's text
     Caption TxtFromWeb{*this, u"TxtFromWeb"}; // the list file's text
     Caption TxtUrl{*this, u"TxtUrl"};         // the rest of the upload's query
 
     static constexpr int Picture1FullWidth = 330;
-    Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // the countdown's panel
+    Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // panel of the countdown
     int Picture1Width = 0;
     Caption Picture5{*this, u"Picture5", Caption::At::Hidden};
     Caption Picture6{*this, u"Picture6", Caption::At::Hidden}; // the end panel
     Caption Pic4Timer{*this, u"Pic4Timer", Caption::At::Hidden};
-    Caption Pic4Hamten{*this, u"Pic4Hamten", Caption::At::Hidden}; // the bar that runs in each pause
+    Caption Pic4Hamten{*this, u"Pic4Hamten", Caption::At::Hidden}; // the bar that moves in each pause
     int Pic4HamtenWidth = 0;
     static constexpr int PicSargel2Width = 1000;
     int PicSargel1Width = 0; // 0 to PicSargel2Width
@@ -28,11 +28,11 @@ struct UploadFormControls : SendingControls {
     Caption Command2{*this, u"Command2", Caption::At::Hidden};   // refresh
     Caption Command3{*this, u"Command3", Caption::At::Hidden};   // stop
     Caption Command10{*this, u"Command10", Caption::At::Hidden}; // continue
-    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // enabled while files travel, and without a handler
-    Caption endClose{*this, u"endClose", Caption::At::Hidden};   // close, in the end
+    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // enabled during a sending; has no handler
+    Caption endClose{*this, u"endClose", Caption::At::Hidden};   // close, at the end
 
-    Caption Label1{*this, u"Label1"};                                // which attempt
-    Caption Label4{*this, u"Label4"};                                // index of the file that has been posted
+    Caption Label1{*this, u"Label1"};                                // number of the attempt
+    Caption Label4{*this, u"Label4"};                                // index of the last posted file
     Caption Label7{*this, u"Label7"};                                // percent
     Caption Label8{*this, u"Label8"};                                // seconds of the countdown
     Caption Label9{*this, u"Label9", Caption::At::Hidden};           // "sending"
@@ -50,12 +50,12 @@ struct UploadFormControls : SendingControls {
     Caption Label4Alu{*this, u"Label4Alu"};                          // "the files went up"
     Caption Label4Tashlum{*this, u"Label4Tashlum"};                  // "call the shop about payment"
     Caption Label4Notru{*this, u"Label4Notru"};                      // "files left to send"
-    Caption Pic4Trouble{*this, u"Pic4Trouble", Caption::At::Hidden}; // the card of a trouble while the order is sent
+    Caption Pic4Trouble{*this, u"Pic4Trouble", Caption::At::Hidden}; // card of a failure during a sending
 };
 
-// UploadForm, "sending an order by HTTP" in the glossary: the customer waits here while one finished order folder goes
-// to the lab's web server. Three attempts go by themselves; a further one takes a click. The local folder stays as it
-// is but for the list that is fetched into it.
+// UploadForm, "sending an order by HTTP" in the glossary: the customer waits while one order folder is sent to the
+// lab's web server. Three attempts follow each other; a further one needs a click. The local folder is unchanged but
+// for the server's list that is downloaded into it.
 class UploadForm : public SendingPage, private UploadFormControls, private SendingEvents {
     Q_OBJECT
 public:
@@ -76,7 +76,7 @@ public:
     void Image5_Click() { sendAgain(); }
     void Image3_Click() { leaveProgram(); }
 
-    // Events that no control sends, the lab's tests of its scripts; UploadFormUnused.cpp.
+    // Events that no control sends, the lab's tests of its scripts; in UploadFormUnused.cpp.
     void Command1_Click(); // "Upload File"
     void Command5_Click();
     void Command6_Click(); // "GetUrlSource"
@@ -86,7 +86,7 @@ public:
     // State.
     const UploadFormControls& controls() const override { return *this; }
     const HttpLists& lists() const { return m_sender.lists; }
-    bool counting() const { return Timer1.running() || Timer2.running(); } // the panel grows or the seconds run
+    bool counting() const { return Timer1.running() || Timer2.running(); } // the panel grows or the seconds count
 
     // The signal is Page::changed().
 
@@ -128,7 +128,7 @@ private:
     Ticker Timer1; // 1 ms: the panel grows
     Ticker Timer2; // 1000 ms: the countdown
     HttpSender m_sender;
-    bool m_busy = false; // a check runs that is no part of an attempt
+    bool m_busy = false; // a check outside an attempt runs
 };
 
 } // namespace lumora

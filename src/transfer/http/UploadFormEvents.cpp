@@ -1,4 +1,4 @@
-// What the rules of the sending tell, put into the words and controls of the page.
+// Shows the events of a sending by HTTP in the page's controls and words.
 #include "order/OrderFolder.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"

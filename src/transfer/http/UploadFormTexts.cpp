@@ -1,4 +1,4 @@
-// All wordings of the page that sends by HTTP, and what it shows of each phase.
+// The wording of the page that sends by HTTP.
 #include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
@@ -85,7 +85,7 @@ constexpr std::array httpLooks{
 
 } // namespace
 
-// Stopped and Unclear are no phases of this page.
+// The page never enters Stopped or Unclear.
 const PhaseLook& UploadForm::lookOf(SendingPhase phase) const {
     const auto* row =
         std::find_if(httpLooks.begin(), httpLooks.end(), [&](const PhaseLook& each) { return each.phase == phase; });
@@ -111,7 +111,7 @@ void UploadForm::showCount() {
                            : Label11.text;
 }
 
-// On the way a trouble is no reason to worry; in the end it is why the order has not gone.
+// A failure during the sending is shown without alarm; at the end it explains why the order was not sent.
 void UploadForm::showTrouble() {
     const bool told = !Label1.text.isEmpty() || Label4Reason.visible;
     Pic4Trouble.visible = told && isUnderWay(phase());

@@ -1,4 +1,4 @@
-// Events of the page that no control of the program sends: the lab's tests of its scripts.
+// Events of the page that no control sends: the lab's tests of its scripts.
 #include "transfer/http/UploadForm.h"
 
 namespace lumora {

@@ -17,7 +17,7 @@ QString address(const QString& url, const QString& folderName, const QString& ex
     return url + QStringLiteral("?folder=") + folderName + u'&' + extra;
 }
 
-// A bare name is its own leaf.
+// LeafName needs a path; a bare name is already a leaf.
 QString leafOf(const QString& path) {
     return path.contains(u'\\') ? LeafName(path) : path;
 }

@@ -29,7 +29,7 @@ void InetForm::reportOrder() {
     m_platform.pump.pump();
     const QString query = OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
     const QString& script = m_state.profile.ReportUrl;
-    // The lab's site is used to a call of this address before each report.
+    // The lab's site expects a call of this address before each report.
     TeshuvatSharat = FetchUrlSmall(script + QStringLiteral("c.txt"));
     TeshuvatSharat = FetchUrlSmall(script + query);
     Q_EMIT changed();

@@ -9,9 +9,9 @@ class PageChain;
 struct Platform;
 struct SessionState;
 
-// InetForm, "the two reports" in the glossary: a page that nobody sees, by which the sending page tells the lab's web
-// site that an order has arrived. The answers are stored and read by nobody, and a report that is lost changes nothing:
-// the order is on the server already.
+// InetForm, "the two reports" in the glossary: a page without a view, by which the sending page tells the lab's web
+// site that an order has arrived. Nothing reads the answers, and a lost report changes nothing: the order is on the
+// server.
 class InetForm : public Page {
     Q_OBJECT
 public:
@@ -25,14 +25,13 @@ public:
     void Command4_Click() {} // "pricelist"
     void cmdLoad_Click() {}  // "Load"
 
-    // The order report and the done call.
     void reportOrder();
     void reportDone();
 
     // State.
     const QString& answer() const { return TeshuvatSharat; } // of the last call
 
-    // The body behind a URL, past every cache; empty when there is none. Without a line a box tells so.
+    // The body at a URL, not from any cache; empty on failure. Without a connection it shows a box.
     QString FetchUrlSmall(const QString& url);
 
 private:
@@ -41,15 +40,15 @@ private:
     QString TeshuvatSharat;
 };
 
-// Fetches a URL to a file under a drive path. True unless the path names no place on this machine: the download's own
-// result is not examined, and only kept for a page that tells a person of it.
+// Downloads a URL to a drive path. True unless the path has no place on this machine: lastFailure() tells whether the
+// download itself failed.
 class clsDownload {
 public:
     explicit clsDownload(const Platform& platform)
         : m_platform(platform) {}
     bool download(const QString& url, const QString& path);
 
-    // Of the last call; the message is empty when it went well.
+    // Of the last call; the message is empty after success.
     const Failure& lastFailure() const { return m_failure; }
 
 private:
