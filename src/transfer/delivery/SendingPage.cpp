@@ -7,6 +7,8 @@
 
 #include <QTimer>
 
+#include <algorithm>
+
 namespace lumora {
 
 namespace {
@@ -48,6 +50,11 @@ void SendingPage::Form_Activate() {
         return;
     m_activated = true;
     begin();
+}
+
+const PhaseLook& SendingPage::look() const {
+    const auto rows = looks();
+    return *std::find_if(rows.begin(), rows.end() - 1, [&](const PhaseLook& row) { return row.phase == m_phase; });
 }
 
 QString SendingPage::wording(const char16_t* hebrew, const char16_t* english) const {

@@ -6,6 +6,8 @@
 #include "transfer/delivery/SendingEvents.h"
 #include "transfer/delivery/SendingPhase.h"
 
+#include <span>
+
 namespace lumora {
 
 class PageChain;
@@ -28,7 +30,7 @@ public:
     void Form_Activate(); // the page has come to the front
 
     SendingPhase phase() const { return m_phase; }
-    const PhaseLook& look() const { return lookOf(m_phase); }
+    const PhaseLook& look() const;
     SendingGauge gauge() const;
     const Countdown& countdown() const { return m_countdown; }
     const SendingControls& sendingControls() const { return m_shown; }
@@ -37,8 +39,8 @@ protected:
     SendingPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain, SendingControls& shown,
                 Countdown countdown);
 
-    // The row of the page's table for the phase.
-    virtual const PhaseLook& lookOf(SendingPhase phase) const = 0;
+    // The page's table: a row for each phase that the page enters.
+    virtual std::span<const PhaseLook> looks() const = 0;
     // The advice of the row with its numbers inserted.
     virtual QString advice(const PhaseLook& row) const;
     // Changes the page's own controls with the phase.

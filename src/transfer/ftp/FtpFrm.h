@@ -60,8 +60,8 @@ public:
     void Command7_Click();
     void cmdInternetOpen_Click();
     void cmdClosehOpen_Click();
-    void optBin_Click();
-    void optAscii_Click();
+    void optBin_Click() { chooseType(true); }
+    void optAscii_Click() { chooseType(false); }
     void chkPassive_Click(bool checked);
     void File1_Click(int index);
     void List2_Click(int index);
@@ -111,11 +111,9 @@ private:
     void FtpEnableControls(bool enable);
 
     // FtpFrmTexts.cpp
-    const PhaseLook& lookOf(SendingPhase phase) const override;
+    std::span<const PhaseLook> looks() const override;
     QString advice(const PhaseLook& row) const override;
     void showPhase(const PhaseLook& row) override;
-    void setButtonTexts();
-    void setPanelTexts();
     void showMinutes();
     void showCounts();
     void showAttempt(int attempt);
@@ -157,6 +155,7 @@ private:
 
     // FtpFrmUnused.cpp
     bool inSession(const QString& message);
+    void chooseType(bool binary);
     QString chosenRemoteName();
 
     FileList File1;

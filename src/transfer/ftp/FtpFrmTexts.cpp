@@ -2,115 +2,14 @@
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/CaptionTexts.h"
-#include "session/SessionState.h"
+#include "transfer/delivery/SendingTexts.h"
 #include "transfer/ftp/FtpFrm.h"
 
-#include <algorithm>
 #include <array>
 
 namespace lumora {
 
 namespace {
-
-using enum SendingButton;
-
-constexpr SendingWords sendingTitle{u"שליחת ההזמנה", u"Sending your order"};
-constexpr SendingWords nothingTitle{u"אין מה לשלוח", u"Nothing can be sent"};
-constexpr SendingWords notCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
-
-constexpr std::array looks{
-    PhaseLook{SendingPhase::Preparing,
-              SendingSign::Seconds,
-              SendNow,
-              {SendNow, Hold},
-              sendingTitle,
-              {u"קוראים את ההזמנה. נא להמתין.", u"Reading the order. Please wait."}},
-    PhaseLook{SendingPhase::NoOrder,
-              SendingSign::Bad,
-              NewOrder,
-              {NewOrder},
-              nothingTitle,
-              {u"אין כאן הזמנה לשליחה.", u"There is no order to send here."}},
-    PhaseLook{SendingPhase::NoServer,
-              SendingSign::Bad,
-              NewOrder,
-              {NewOrder},
-              nothingTitle,
-              {u"לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות.",
-               u"No server is set for orders. The order is kept on this computer. Please tell the shop."}},
-    PhaseLook{SendingPhase::Countdown,
-              SendingSign::Seconds,
-              SendNow,
-              {SendNow, Hold},
-              {u"ההזמנה מוכנה לשליחה", u"Your order is ready to be sent"},
-              {u"ההזמנה מוכנה. השליחה תתחיל מעצמה בתום הספירה.",
-               u"The order is ready. Sending begins by itself when the count ends."}},
-    PhaseLook{
-        SendingPhase::Waiting,
-        SendingSign::Seconds,
-        SendNow,
-        {SendNow, Hold},
-        sendingTitle,
-        {u"הספירה נעצרה. כדי לשלוח יש ללחוץ על הלחצן שלח עכשיו.", u"The count is stopped. Press Send now to send."}},
-    PhaseLook{SendingPhase::Sending,
-              SendingSign::Percent,
-              None,
-              {Stop},
-              sendingTitle,
-              {u"ההזמנה נשלחת. נא לא לסגור את התוכנה.", u"The order is being sent. Please do not close the program."}},
-    PhaseLook{SendingPhase::Checking,
-              SendingSign::Percent,
-              None,
-              {Stop},
-              sendingTitle,
-              {u"בודקים אילו קבצים הגיעו לשרת. נא להמתין.", u"Checking which files have arrived. Please wait."}},
-    PhaseLook{SendingPhase::Reporting,
-              SendingSign::Percent,
-              None,
-              {Stop},
-              sendingTitle,
-              {u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
-               u"The whole order has arrived. Telling the shop, please wait."}},
-    PhaseLook{SendingPhase::Success,
-              SendingSign::Good,
-              NewOrder,
-              {NewOrder, Close},
-              {u"ההזמנה נשלחה", u"Your order was sent"},
-              {u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
-               u"The whole order has arrived. You can close, or begin a new order."}},
-    // %1: files on the server, %2: files of the order; likewise in the next row.
-    PhaseLook{SendingPhase::AllThere,
-              SendingSign::Good,
-              NewOrder,
-              {NewOrder, Close},
-              {u"ההזמנה נמצאת בשרת", u"Your order is on the server"},
-              {u"כל %2 הקבצים של משלוח זה נמצאים בשרת, ובתיקייה שם %1 קבצים. אין צורך לשלוח שוב. יש להודיע על כך "
-               u"לחנות.",
-               u"All %2 files of this sending are on the server, whose folder holds %1. There is no need to send "
-               u"again. Please tell the shop."}},
-    PhaseLook{SendingPhase::Unclear,
-              SendingSign::Unclear,
-              SendAgain,
-              {SendAgain, NewOrder},
-              {u"לא ברור אם כל ההזמנה הגיעה", u"It is not clear whether all has arrived"},
-              {u"הגיעו %1 מתוך %2 קבצים. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח שוב. אם זה חוזר, יש להודיע "
-               u"לחנות.",
-               u"%1 of %2 files have arrived. Press Send again to check and send once more. If this comes again, "
-               u"please tell the shop."}},
-    PhaseLook{SendingPhase::NotAll,
-              SendingSign::Bad,
-              SendAgain,
-              {SendAgain, NewOrder},
-              notCompleteTitle,
-              {u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן שלח שוב.", u"Wait 30 seconds, then press Send again."}},
-    PhaseLook{
-        SendingPhase::Stopped,
-        SendingSign::Bad,
-        SendAgain,
-        {SendAgain, NewOrder},
-        notCompleteTitle,
-        {u"השליחה נעצרה. כדי להמשיך יש ללחוץ על הלחצן שלח שוב.", u"Sending was stopped. Press Send again to go on."}},
-};
 
 constexpr std::array attemptTitles{
     SendingWords{u"", u""},
@@ -122,8 +21,70 @@ constexpr std::array attemptTitles{
 
 } // namespace
 
-const PhaseLook& FtpFrm::lookOf(SendingPhase phase) const {
-    return *std::find_if(looks.begin(), looks.end(), [&](const PhaseLook& row) { return row.phase == phase; });
+std::span<const PhaseLook> FtpFrm::looks() const {
+    using enum SendingButton;
+    constexpr SendingWords nothingTitle{u"אין מה לשלוח", u"Nothing can be sent"};
+    static constexpr std::array rows{
+        PhaseLook{SendingPhase::Preparing,
+                  SendingSign::Seconds,
+                  SendNow,
+                  {SendNow, Hold},
+                  sendingTitle,
+                  {u"קוראים את ההזמנה. נא להמתין.", u"Reading the order. Please wait."}},
+        PhaseLook{SendingPhase::NoOrder, SendingSign::Bad, NewOrder, {NewOrder}, nothingTitle, noOrderAdvice},
+        PhaseLook{SendingPhase::NoServer, SendingSign::Bad, NewOrder, {NewOrder}, nothingTitle, noServerAdvice},
+        PhaseLook{SendingPhase::Countdown, SendingSign::Seconds, SendNow, {SendNow, Hold}, readyTitle, readyAdvice},
+        PhaseLook{SendingPhase::Waiting,
+                  SendingSign::Seconds,
+                  SendNow,
+                  {SendNow, Hold},
+                  sendingTitle,
+                  {u"הספירה נעצרה. כדי לשלוח יש ללחוץ על הלחצן שלח עכשיו.",
+                   u"The count is stopped. Press Send now to send."}},
+        PhaseLook{SendingPhase::Sending, SendingSign::Percent, None, {Stop}, sendingTitle, sendingAdvice},
+        PhaseLook{SendingPhase::Checking, SendingSign::Percent, None, {Stop}, sendingTitle, checkingAdvice},
+        PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {Stop}, sendingTitle, reportingAdvice},
+        PhaseLook{SendingPhase::Success,
+                  SendingSign::Good,
+                  NewOrder,
+                  {NewOrder, Close},
+                  sentTitle,
+                  {u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
+                   u"The whole order has arrived. You can close, or begin a new order."}},
+        // %1: files on the server, %2: files of the order; likewise in the next row.
+        PhaseLook{SendingPhase::AllThere,
+                  SendingSign::Good,
+                  NewOrder,
+                  {NewOrder, Close},
+                  {u"ההזמנה נמצאת בשרת", u"Your order is on the server"},
+                  {u"כל %2 הקבצים של משלוח זה נמצאים בשרת, ובתיקייה שם %1 קבצים. אין צורך לשלוח שוב. יש להודיע על כך "
+                   u"לחנות.",
+                   u"All %2 files of this sending are on the server, whose folder holds %1. There is no need to send "
+                   u"again. Please tell the shop."}},
+        PhaseLook{SendingPhase::Unclear,
+                  SendingSign::Unclear,
+                  SendAgain,
+                  {SendAgain, NewOrder},
+                  {u"לא ברור אם כל ההזמנה הגיעה", u"It is not clear whether all has arrived"},
+                  {u"הגיעו %1 מתוך %2 קבצים. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח שוב. אם זה חוזר, יש להודיע "
+                   u"לחנות.",
+                   u"%1 of %2 files have arrived. Press Send again to check and send once more. If this comes again, "
+                   u"please tell the shop."}},
+        PhaseLook{SendingPhase::NotAll,
+                  SendingSign::Bad,
+                  SendAgain,
+                  {SendAgain, NewOrder},
+                  notCompleteTitle,
+                  {u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן שלח שוב.", u"Wait 30 seconds, then press Send again."}},
+        PhaseLook{SendingPhase::Stopped,
+                  SendingSign::Bad,
+                  SendAgain,
+                  {SendAgain, NewOrder},
+                  notCompleteTitle,
+                  {u"השליחה נעצרה. כדי להמשיך יש ללחוץ על הלחצן שלח שוב.",
+                   u"Sending was stopped. Press Send again to go on."}},
+    };
+    return rows;
 }
 
 QString FtpFrm::advice(const PhaseLook& row) const {
@@ -132,6 +93,7 @@ QString FtpFrm::advice(const PhaseLook& row) const {
 }
 
 void FtpFrm::showPhase(const PhaseLook& row) {
+    using enum SendingButton;
     const bool underWay = isUnderWay(row.phase);
     const bool ended = row.main == SendAgain;
     Command15.enabled = Command21.enabled = underWay && row.phase != SendingPhase::Reporting;
@@ -154,75 +116,62 @@ void FtpFrm::showMinutes() {
 }
 
 void FtpFrm::setTexts() {
-    setButtonTexts();
-    setPanelTexts();
+    setCaptions(
+        m_state,
+        {{Command12, u"שלח ", u"Send "},
+         {Command10, u"שלח שוב", u"Send again"},
+         {Command28, u"הזמנה חדשה", u"New order"},
+         {Command15, u"עצור", u"Stop"},
+         {Command21, u"Stop", u"Stop"},
+         {Command18, u"עצור ספירה", u"Stop the count"},
+         {Command11, u"יציאה", u"Exit"},
+         {Command8, u"יציאה", u"Exit"},
+         {Command14, u"לא לסגור", u"Do not close"},
+         {Command16, u"סגור את התוכנה למרות שלא נשלחו התמונות",
+          u"Close the program although the pictures were not sent"},
+         {Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here"},
+         {Command24, u"הצג יותר פרטים", u"Show more details"},
+         {Command9, u"הסתר פרטים", u"Hide details"},
+         {Image3, u"סגור", u"Close"},
+         {Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder"},
+         {Image5, u"שלח עכשיו", u"Send now"},
+         {Command13, u"לפני שליחה", u"Before sending"},
+         {Command1, u"משלוח חוזר", u"Resend"},
+         {Command2, u"מילוי ושליחה", u"Refill and send"},
+         {Command4, u"שליחה בסבבים", u"Send in rounds"},
+         {Command3, u"put", u"put"},
+         {Command5, u"get", u"get"},
+         {Command6, u"del", u"del"},
+         {Command7, u"make dir", u"make dir"},
+         {Command17, u"SendOneOrder", u"SendOneOrder"},
+         {Command19, u"All Orders", u"All Orders"},
+         {Command25, u"BdikaAfterUploadB", u"BdikaAfterUploadB"},
+         {Command27, u"Copy", u"Copy"},
+         {Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
+          u"We have noted that you asked to get the printed pictures by delivery to your home"},
+         {Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload "},
+         {Label4Mitoch, u"קבצים מתוך ", u"files out of "},
+         {Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending "},
+         {Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
+          u"It is advised to wait 30 seconds and then press Send again"},
+         {Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
+          u"The order is kept on this computer, and files that have arrived are not sent again."},
+         {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
+         {Label4Minutes, u"דקות", u"minutes"},
+         {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
+         {Label4Summary, u"סיכום ההזמנה", u"Summary of your order"},
+         {Label4ToSend, u"קבצים לשליחה", u"Files to be sent"},
+         {Label4OnServer, u"נמצאים בשרת", u"On the server"},
+         {Label4Failed, u"שליחה שנכשלה", u"Failed"},
+         {Label4Log, u"יומן", u"Log"},
+         {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
+          u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
+          u"pictures "
+          u"will be printed."}});
+    txtProxy.hint = QStringLiteral("TIS Compatible Proxy (No CERN):");
     showCounts();
     tellPhase();
     Q_EMIT changed();
-}
-
-void FtpFrm::setButtonTexts() {
-    setCaptions(m_state,
-                {
-                    {Command12, u"שלח ", u"Send "},
-                    {Command10, u"שלח שוב", u"Send again"},
-                    {Command28, u"הזמנה חדשה", u"New order"},
-                    {Command15, u"עצור", u"Stop"},
-                    {Command21, u"Stop", u"Stop"},
-                    {Command18, u"עצור ספירה", u"Stop the count"},
-                    {Command11, u"יציאה", u"Exit"},
-                    {Command8, u"יציאה", u"Exit"},
-                    {Command14, u"לא לסגור", u"Do not close"},
-                    {Command16, u"סגור את התוכנה למרות שלא נשלחו התמונות",
-                     u"Close the program although the pictures were not sent"},
-                    {Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here"},
-                    {Command24, u"הצג יותר פרטים", u"Show more details"},
-                    {Command9, u"הסתר פרטים", u"Hide details"},
-                    {Image3, u"סגור", u"Close"},
-                    {Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder"},
-                    {Image5, u"שלח עכשיו", u"Send now"},
-                    {Command13, u"לפני שליחה", u"Before sending"},
-                    {Command1, u"משלוח חוזר", u"Resend"},
-                    {Command2, u"מילוי ושליחה", u"Refill and send"},
-                    {Command4, u"שליחה בסבבים", u"Send in rounds"},
-                    {Command3, u"put"},
-                    {Command5, u"get"},
-                    {Command6, u"del"},
-                    {Command7, u"make dir"},
-                    {Command17, u"SendOneOrder"},
-                    {Command19, u"All Orders"},
-                    {Command25, u"BdikaAfterUploadB"},
-                    {Command27, u"Copy"},
-                });
-    txtProxy.hint = QStringLiteral("TIS Compatible Proxy (No CERN):");
-}
-
-void FtpFrm::setPanelTexts() {
-    setCaptions(
-        m_state,
-        {
-            {Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
-             u"We have noted that you asked to get the printed pictures by delivery to your home"},
-            {Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload "},
-            {Label4Mitoch, u"קבצים מתוך ", u"files out of "},
-            {Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending "},
-            {Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
-             u"It is advised to wait 30 seconds and then press Send again"},
-            {Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
-             u"The order is kept on this computer, and files that have arrived are not sent again."},
-            {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
-            {Label4Minutes, u"דקות", u"minutes"},
-            {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
-            {Label4Summary, u"סיכום ההזמנה", u"Summary of your order"},
-            {Label4ToSend, u"קבצים לשליחה", u"Files to be sent"},
-            {Label4OnServer, u"נמצאים בשרת", u"On the server"},
-            {Label4Failed, u"שליחה שנכשלה", u"Failed"},
-            {Label4Log, u"יומן", u"Log"},
-            {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
-             u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
-             u"pictures "
-             u"will be printed."},
-        });
 }
 
 void FtpFrm::showCounts() {

@@ -83,17 +83,10 @@ void FtpFrm::cmdClosehOpen_Click() {
 
 // Both buttons set the same transfer type: the lab's server takes all files, pictures too, as ASCII and keeps their
 // bytes.
-void FtpFrm::optBin_Click() {
+void FtpFrm::chooseType(bool binary) {
     m_sender.session.dwType = 1;
-    optBin.checked = true;
-    optAscii.checked = false;
-    Q_EMIT changed();
-}
-
-void FtpFrm::optAscii_Click() {
-    m_sender.session.dwType = 1;
-    optAscii.checked = true;
-    optBin.checked = false;
+    optBin.checked = binary;
+    optAscii.checked = !binary;
     Q_EMIT changed();
 }
 

@@ -108,12 +108,16 @@ private:
     void leaveForAnother();
 
     // UploadFormTexts.cpp
-    const PhaseLook& lookOf(SendingPhase phase) const override;
+    std::span<const PhaseLook> looks() const override;
     void showPhase(const PhaseLook& row) override;
     void showCount();
     void showTrouble();
     void showLeft(int files);
     void showAnswers();
+
+    // UploadFormUnused.cpp
+    template <class Test>
+    void run(const Test& test);
 
     // UploadFormEvents.cpp
     void reached(SendingMoment moment, int number) override;

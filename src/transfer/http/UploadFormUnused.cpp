@@ -3,49 +3,42 @@
 
 namespace lumora {
 
-void UploadForm::Command1_Click() {
+template <class Test>
+void UploadForm::run(const Test& test) {
     if (!idle())
         return;
-    m_sender.postTestPicture();
+    test();
     showAnswers();
     Q_EMIT changed();
+}
+
+void UploadForm::Command1_Click() {
+    run([this] { m_sender.postTestPicture(); });
 }
 
 void UploadForm::Command5_Click() {
-    if (!idle())
-        return;
-    m_sender.postNothing();
-    showAnswers();
-    Q_EMIT changed();
+    run([this] { m_sender.postNothing(); });
 }
 
 void UploadForm::Command6_Click() {
-    if (!idle())
-        return;
-    m_sender.fetchTestListing();
-    showAnswers();
-    Q_EMIT changed();
+    run([this] { m_sender.fetchTestListing(); });
 }
 
 void UploadForm::Command7_Click() {
-    if (!idle())
-        return;
-    m_busy = true;
-    m_sender.lists.TxtWeb = QString::number(static_cast<int>(m_sender.CheckOrderOnServer(0)));
-    m_busy = false;
-    showAnswers();
-    Q_EMIT changed();
+    run([this] {
+        m_busy = true;
+        m_sender.lists.TxtWeb = QString::number(static_cast<int>(m_sender.CheckOrderOnServer(0)));
+        m_busy = false;
+    });
 }
 
 void UploadForm::Command8_Click() {
-    if (!idle())
-        return;
-    m_busy = true;
-    m_sender.HttpFetchFileListN(0);
-    m_busy = false;
-    m_sender.readListInOrder();
-    showAnswers();
-    Q_EMIT changed();
+    run([this] {
+        m_busy = true;
+        m_sender.HttpFetchFileListN(0);
+        m_busy = false;
+        m_sender.readListInOrder();
+    });
 }
 
 } // namespace lumora

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "transfer/delivery/SendingPhase.h"
+
+// The words that the phases of both sending pages share.
+namespace lumora {
+
+inline constexpr SendingWords sendingTitle{u"שליחת ההזמנה", u"Sending your order"};
+inline constexpr SendingWords readyTitle{u"ההזמנה מוכנה לשליחה", u"Your order is ready to be sent"};
+inline constexpr SendingWords sentTitle{u"ההזמנה נשלחה", u"Your order was sent"};
+inline constexpr SendingWords notCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
+
+inline constexpr SendingWords noOrderAdvice{u"אין כאן הזמנה לשליחה.", u"There is no order to send here."};
+inline constexpr SendingWords noServerAdvice{
+    u"לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות.",
+    u"No server is set for orders. The order is kept on this computer. Please tell the shop."};
+inline constexpr SendingWords readyAdvice{u"ההזמנה מוכנה. השליחה תתחיל מעצמה בתום הספירה.",
+                                          u"The order is ready. Sending begins by itself when the count ends."};
+inline constexpr SendingWords sendingAdvice{u"ההזמנה נשלחת. נא לא לסגור את התוכנה.",
+                                            u"The order is being sent. Please do not close the program."};
+inline constexpr SendingWords checkingAdvice{u"בודקים אילו קבצים הגיעו לשרת. נא להמתין.",
+                                             u"Checking which files have arrived. Please wait."};
+inline constexpr SendingWords reportingAdvice{u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
+                                              u"The whole order has arrived. Telling the shop, please wait."};
+
+} // namespace lumora
