@@ -11,7 +11,6 @@
 
 #include <cmath>
 #include <sys/stat.h>
-#include <thread>
 
 namespace lumora {
 namespace {
@@ -226,23 +225,6 @@ TEST_F(PictureFileTest, qualityIsHeldBetween0And100) {
     EXPECT_FALSE(encodeJpeg(Bitmap(), 90));
 }
 
-TEST_F(PictureFileTest, aSaveThatFailsKeepsTheOldFile) {
-    const fs::path old = write("old.jpg", "old");
-    fs::permissions(in(""), fs::perms::owner_read | fs::perms::owner_exec);
-    const auto saved = saveJpeg(testPicture(20, 20), old, 90);
-    fs::permissions(in(""), fs::perms::owner_all);
-    if (::geteuid() != 0) {
-        ASSERT_FALSE(saved);
-        EXPECT_EQ(saved.failure().kind, Failure::Kind::AccessDenied);
-    }
-    const auto nowhere = saveJpeg(testPicture(20, 20), in("no such folder") / "a.jpg", 90);
-    ASSERT_FALSE(nowhere);
-    EXPECT_EQ(nowhere.failure().kind, Failure::Kind::NotFound);
-    const auto overFolder = saveJpeg(testPicture(20, 20), in(""), 90);
-    EXPECT_FALSE(overFolder);
-    EXPECT_EQ(leftovers(), QStringList{u"old.jpg"_s});
-}
-
 TEST_F(PictureFileTest, theSmallPictureFillsItsCellByTheLongerSide) {
     struct Case {
         PictureSize picture;
@@ -268,19 +250,6 @@ TEST_F(PictureFileTest, smallPicturesComeInOrderWithAFailureInItsPlace) {
         }
     }
     EXPECT_TRUE(loadSmallPictures({}, 90).empty());
-}
-
-TEST_F(PictureFileTest, threadsGiveTheSameBytes) {
-    const fs::path path = write("a.jpg", jpegOfKind(testPicture(1200, 900), {.across = 2, .down = 2}));
-    const QByteArray alone = *scalePictureToJpeg(path, {450, 338}, 90);
-    QByteArray first;
-    QByteArray second;
-    {
-        std::jthread other([&] { second = *scalePictureToJpeg(path, {450, 338}, 90); });
-        first = *scalePictureToJpeg(path, {450, 338}, 90);
-    }
-    EXPECT_EQ(first, alone);
-    EXPECT_EQ(second, alone);
 }
 
 } // namespace

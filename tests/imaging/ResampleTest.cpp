@@ -60,30 +60,6 @@ TEST(ResampleTest, theSameSizeIsTheSamePicture) {
     EXPECT_EQ(resampled(picture, {123, 77}).image(), picture.image());
 }
 
-TEST(ResampleTest, aMirroredPictureGivesTheMirroredResult) {
-    const Bitmap picture = testPicture(203, 151);
-    const Bitmap mirrored(picture.image().mirrored(true, true));
-    // Half rounds up, so a mirrored sum may differ in its last bit.
-    const ReferencePlane a = lumaOf(resampled(picture, {90, 67}));
-    const ReferencePlane b = lumaOf(Bitmap(resampled(mirrored, {90, 67}).image().mirrored(true, true)));
-    EXPECT_GT(peakSignalToNoise(a, b), 70);
-}
-
-TEST(ResampleTest, aFineCheckerBecomesEvenGrey) {
-    Bitmap checker(64, 64, Qt::black);
-    for (int y = 0; y < 64; ++y) {
-        for (int x = 0; x < 64; ++x) {
-            if ((x / 2 + y / 2) % 2 != 0)
-                checker.image().setPixel(x, y, qRgb(255, 255, 255));
-        }
-    }
-    const Bitmap small = resampled(checker, {16, 16});
-    for (int y = 1; y < 15; ++y) {
-        for (int x = 1; x < 15; ++x)
-            EXPECT_NEAR(qGreen(small.image().pixel(x, y)), 127.5, 4) << x << ", " << y;
-    }
-}
-
 TEST(ResampleTest, staysWithinTheRoundingOfTheExactCurve) {
     const Bitmap photograph = samplePhotograph({803, 601}, 7);
     for (const PictureSize size :
@@ -128,18 +104,6 @@ TEST(ResampleTest, aScaledDecodeKeepsTwiceThePixelsWanted) {
     EXPECT_EQ(decodeDenominator({4000, 3000}, {115, 86}), 8);
     EXPECT_EQ(decodeDenominator({4000, 3000}, {251, 188}), 4);
     EXPECT_EQ(decodeDenominator({10, 10}, {1, 1}), 4);
-}
-
-TEST(DrawingTest, fourQuarterTurnsAreThePictureAgain) {
-    const Bitmap picture = testPicture(40, 30);
-    for (const QuarterTurn turn : {QuarterTurn::Right, QuarterTurn::Left}) {
-        Bitmap result = picture;
-        for (int i = 0; i < 4; ++i)
-            result = turned(result, turn);
-        EXPECT_EQ(result.image(), picture.image());
-    }
-    EXPECT_EQ(turned(turned(picture, QuarterTurn::Half), QuarterTurn::Half).image(), picture.image());
-    EXPECT_EQ(turned(turned(picture, QuarterTurn::Right), QuarterTurn::Left).image(), picture.image());
 }
 
 TEST(DrawingTest, aTurnedPictureHasItsCornersInTheirPlaces) {

@@ -108,6 +108,7 @@ TEST(BrokenFiles, ComeBackAsTheyWereWritten) {
     broken.append(u"C:\\תמונות\\a.jpp"_s);
     broken.append(u"C:\\b.jpp"_s);
     ASSERT_TRUE(WriteBrokenFiles(test.files, OrderFolder(u"C:"_s), broken));
+    EXPECT_EQ(*test.files.read(u"C:\\kashloo.txt"_s), "C:\\\xFA\xEE\xE5\xF0\xE5\xFA\\a.jpp\r\nC:\\b.jpp\r\n");
     EXPECT_EQ(ReadBrokenFiles(test.files, OrderFolder(u"C:\\"_s)), broken.items());
     EXPECT_TRUE(IsBroken(broken, u"b.jpp"_s));
     EXPECT_FALSE(IsBroken(broken, u"B.jpp"_s));

@@ -13,17 +13,6 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-TEST(QtEventPump, LetsATimerRunWhileALoopGoesOn) {
-    QtEventPump pump;
-    bool ran = false;
-    QTimer::singleShot(0, [&] { ran = true; });
-    QElapsedTimer waiting;
-    waiting.start();
-    while (!ran && waiting.elapsed() < 5000)
-        pump.pump();
-    EXPECT_TRUE(ran);
-}
-
 TEST(QtEventPump, TellsAHandlerInsideThatAPumpIsUnderWay) {
     QtEventPump pump;
     int depth = 0;

