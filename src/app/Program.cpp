@@ -35,6 +35,7 @@ struct Program::Parts {
         , files(drives)
         , instances(dataFolder)
         , volume(drives)
+        , internet({}, deployment.ftpType)
         , shell(drives)
         , chain(pump)
         , window(chain, state)

@@ -31,7 +31,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "Password = \" a;b#c=d \"\n"
               "Folder1 = \xD7\x90\n"
               "JppChunks=32767\n"
-              "JppTail = 60\n"
+              "JppTail = 60\nType = i\n"
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
               "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = ask\n"
@@ -47,6 +47,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(lab.profile.FtpFolder1, u"א");
     EXPECT_EQ(lab.profile.JppChunks, 32767);
     EXPECT_EQ(lab.SugTzad, 60);
+    EXPECT_EQ(lab.ftpType, FtpType::Image);
     EXPECT_EQ(lab.profile.SizeList[1], u"20/30");
     EXPECT_EQ(lab.profile.SizeList[2], u"");
     EXPECT_EQ(lab.profile.QuickSizes[2], u"20/30");

@@ -29,47 +29,56 @@ bool strikes(int& counter) {
 class FakeConnection : public FtpConnection {
 public:
     explicit FakeConnection(FakeLab& lab)
-        : m_lab(lab) {}
+        : m_lab(lab)
+        , m_aborts(lab.aborts) {}
 
     Result<void> setCurrentDirectory(const QString& directory) override {
-        if (m_cut)
+        if (isCut())
             return cut();
         const QString target = directory.startsWith(u'/') ? directory.mid(1) : below(directory);
         if (!m_lab.folders.contains(target) || (m_lab.refusesEntry && target.contains(u'^')))
-            return refused(u"550 Failed to change directory."_s);
+            return no(u"550 Failed to change directory."_s);
         m_here = target;
         return {};
     }
 
     Result<QString> currentDirectory() override {
-        if (m_cut)
+        if (isCut())
             return cut();
         return u'/' + m_here;
     }
 
     Result<void> makeDirectory(const QString& name) override {
-        if (m_cut)
+        if (isCut())
             return cut();
-        if (m_lab.refusesFolders || m_lab.folders.contains(below(name)))
-            return refused(u"550 Create directory operation failed."_s);
+        if (isBroken(name) || m_lab.refusesFolders || m_lab.folders.contains(below(name)))
+            return no(u"550 Create directory operation failed."_s);
         m_lab.folders[below(name)];
         return {};
     }
 
     Result<void> put(const HostPath& local, const QString& remoteName) override {
-        if (m_cut)
+        if (isCut())
             return cut();
+        std::ifstream in(local, std::ios::binary);
+        if (!in)
+            return Failure{Failure::Kind::NotFound, remoteName};
+        if (isBroken(remoteName))
+            return no(u"553 Could not create file."_s);
         m_lab.puts += remoteName;
         if (m_lab.onPut)
             m_lab.onPut(remoteName);
-        std::ifstream in(local, std::ios::binary);
         const std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
         QByteArray content = QByteArray::fromStdString(bytes);
+        if (isCut()) { // meanwhile
+            m_lab.folders[m_here][remoteName] = content.left(content.size() / 2);
+            return cut();
+        }
         for (FakeLab::PutFault& fault : m_lab.putFaults) {
             if ((!fault.name.isEmpty() && fault.name != remoteName) || !strikes(fault.times))
                 continue;
             if (fault.cutAfter < 0)
-                return refused(u"553 Could not create file."_s);
+                return no(u"553 Could not create file."_s);
             m_lab.folders[m_here][remoteName] = content.left(fault.cutAfter);
             m_cut = true;
             return cut();
@@ -80,47 +89,70 @@ public:
 
     Result<void> get(const QString& remoteName, const HostPath& local) override {
         const FakeLab::Folder& folder = m_lab.folders[m_here];
-        if (m_cut || !folder.contains(remoteName))
-            return m_cut ? cut() : refused(u"550 Failed to open file."_s);
+        if (isCut() || !folder.contains(remoteName))
+            return isCut() ? Result<void>(cut()) : no(u"550 Failed to open file."_s);
         const QByteArray& bytes = folder.at(remoteName);
         std::ofstream(local, std::ios::binary).write(bytes.constData(), bytes.size());
         return {};
     }
 
     Result<void> remove(const QString& remoteName) override {
-        if (m_cut)
+        if (isCut())
             return cut();
         m_lab.deletes += remoteName;
         if (m_lab.refusesDelete || m_lab.folders[m_here].erase(remoteName) == 0)
-            return refused(u"550 Delete operation failed."_s);
+            return no(u"550 Delete operation failed."_s);
         return {};
     }
 
-    Result<std::vector<FtpEntry>> list(const QString&) override {
-        if (m_cut || strikes(m_lab.failedListings)) {
+    Result<FtpListing> list(const QString& pattern, EmptyFolder empty) override {
+        if (isCut() || strikes(m_lab.failedListings)) {
             m_cut = true;
             return cut();
         }
-        std::vector<FtpEntry> entries;
+        if (isBroken(pattern))
+            return no(u"550 No such file."_s).failure();
+        FtpListing listing;
         if (m_lab.listsDots)
-            entries = {{u"."_s, true}, {u".."_s, true}};
+            listing.entries = {{u"."_s, true}, {u".."_s, true}};
         const QString prefix = m_here.isEmpty() ? QString() : m_here + u'/';
         for (const auto& [path, folder] : m_lab.folders) {
             if (!path.isEmpty() && path.startsWith(prefix) && !path.mid(prefix.size()).contains(u'/'))
-                entries.push_back({path.mid(prefix.size()), true});
+                listing.entries.push_back({path.mid(prefix.size()), true});
         }
         for (const auto& [name, bytes] : m_lab.folders[m_here])
-            entries.push_back({name, false});
-        return entries;
+            listing.entries.push_back({name, false, bytes.size()});
+        if (listing.entries.empty() && m_lab.refusesEmptyListings && empty == EmptyFolder::IsListed)
+            return no(u"550 No files found."_s).failure();
+        if (m_here.contains(u'^'))
+            listing.unread = m_lab.unreadLine;
+        return listing;
     }
 
-    QString lastResponse() const override { return {}; }
+    Result<std::optional<qint64>> length(const QString& remoteName) override {
+        if (isCut())
+            return cut();
+        const FakeLab::Folder& folder = m_lab.folders[m_here];
+        return folder.contains(remoteName) ? std::optional<qint64>(folder.at(remoteName).size()) : std::nullopt;
+    }
+
+    QString lastResponse() const override { return m_response; }
 
 private:
     QString below(const QString& name) const { return m_here.isEmpty() ? name : m_here + u'/' + name; }
+    bool isCut() const { return m_cut || m_lab.aborts != m_aborts; }
+    static bool isBroken(const QString& name) {
+        return name.contains(u'\r') || name.contains(u'\n') || name.contains(QChar(0));
+    }
+    Result<void> no(const QString& reply) {
+        m_response = reply;
+        return refused(reply);
+    }
 
     FakeLab& m_lab;
+    int m_aborts;
     QString m_here;
+    QString m_response;
     bool m_cut = false;
 };
 
@@ -151,6 +183,11 @@ Result<QByteArray> FakeLab::fetch(const QString& url) {
 Result<QByteArray> FakeLab::post(const QString& url, const PostRequest&) {
     urls += url;
     return QByteArray("ok");
+}
+
+Result<std::optional<qint64>> FakeLab::contentLength(const QString& url) {
+    urls += url;
+    return std::optional<qint64>();
 }
 
 Result<void> FakeLab::download(const QString& url, const HostPath& target) {

@@ -22,10 +22,12 @@ public:
     static constexpr int always = -1;
 
     // How often from now on; always is for good.
-    int deadOpens = 0;      // the machine has no way out
-    int deadConnects = 0;   // nobody answers
-    int refusedLogins = 0;  // wrong user or password
-    int failedListings = 0; // the line is cut while a listing comes
+    int deadOpens = 0;                 // the machine has no way out
+    int deadConnects = 0;              // nobody answers
+    int refusedLogins = 0;             // wrong user or password
+    int failedListings = 0;            // the line is cut while a listing comes
+    bool refusesEmptyListings = false; // with 550
+    QString unreadLine;                // stands in each listing of an order's folder
     bool refusesDelete = false;
     bool refusesFolders = false; // no folder can be made
     bool refusesEntry = false;   // the order's folder can't be entered
@@ -48,6 +50,7 @@ public:
     QStringList puts;    // names, also of puts that failed
     QStringList deletes; // names
     int connects = 0;
+    int aborts = 0;   // each cuts the connections that stand then
     QStringList urls; // in order, as the client gave them
 
     bool open() override;
@@ -56,6 +59,8 @@ public:
                                                       DataChannel channel) override;
     Result<QByteArray> fetch(const QString& url) override;
     Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<std::optional<qint64>> contentLength(const QString& url) override;
+    void abort() override { ++aborts; }
     Result<void> download(const QString& url, const HostPath& target) override;
 
     DataChannel lastChannel = DataChannel::Passive;

@@ -76,6 +76,17 @@ Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& reque
     return QByteArray("stored");
 }
 
+Result<std::optional<qint64>> FakeWebLab::contentLength(const QString& url) {
+    urls += url;
+    if (strikes(deadCalls))
+        return down();
+    const QString folder = between(url, u"/uploads/"_s, u"/"_s);
+    const QString name = url.mid(url.lastIndexOf(u'/') + 1);
+    if (!uploads.contains(folder) || !uploads[folder].contains(name))
+        return std::optional<qint64>();
+    return std::optional<qint64>(uploads[folder][name].size());
+}
+
 Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {
     urls += url;
     if (strikes(deadCalls))

@@ -25,6 +25,7 @@ public:
 
     Result<QByteArray> fetch(const QString& url) override;
     Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<std::optional<qint64>> contentLength(const QString& url) override;
     Result<void> download(const QString& url, const HostPath& target) override;
 
     QByteArray listOf(const QString& folder) const;

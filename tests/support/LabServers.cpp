@@ -101,27 +101,6 @@ QByteArray LabServers::ftpLog() const {
     return contentOf(folder() / "log" / "ftp.log");
 }
 
-SecondFtpServer::SecondFtpServer() {
-    m_server.setProcessChannelMode(QProcess::MergedChannels);
-    for (int attempt = 0; attempt < 3; ++attempt) {
-        m_port = FreePort();
-        // Debian's own interpreter: another python in the path would not have the module.
-        m_server.start(u"/usr/bin/python3"_s,
-                       {u"-m"_s, u"pyftpdlib"_s, u"-i"_s, u"127.0.0.1"_s, u"-p"_s, QString::number(m_port), u"-w"_s,
-                        u"-d"_s, m_folder.path(), u"-u"_s, user(), u"-P"_s, password()});
-        if (ComesUp(m_server, m_port))
-            return;
-    }
-    m_failure = u"pyftpdlib did not start: "_s + QString::fromUtf8(m_server.readAll());
-}
-
-SecondFtpServer::~SecondFtpServer() {
-    if (m_server.state() != QProcess::NotRunning) {
-        m_server.kill();
-        m_server.waitForFinished(5'000);
-    }
-}
-
 SecondWebServer::SecondWebServer() {
     std::filesystem::create_directory(uploads());
     m_server.setProcessChannelMode(QProcess::MergedChannels);

@@ -57,28 +57,6 @@ private:
     quint16 m_httpPort = 0;
 };
 
-// A second kind of FTP server, one that turns CR LF into LF under type ASCII and refuses a listing by pattern.
-class SecondFtpServer {
-public:
-    SecondFtpServer();
-    ~SecondFtpServer();
-    SecondFtpServer(const SecondFtpServer&) = delete;
-    SecondFtpServer& operator=(const SecondFtpServer&) = delete;
-
-    bool running() const { return m_failure.isEmpty(); }
-    QString failure() const { return m_failure; }
-    QString ftpHost() const { return u"127.0.0.1:%1"_s.arg(m_port); }
-    static QString user() { return u"lumora"_s; }
-    static QString password() { return u"second-lab"_s; }
-    HostPath account() const { return toHostPath(m_folder.path()); }
-
-private:
-    QTemporaryDir m_folder;
-    QProcess m_server;
-    QString m_failure;
-    quint16 m_port = 0;
-};
-
 // A second kind of web server over the same scripts: lighttpd, which runs php-cgi anew for each request.
 class SecondWebServer {
 public:

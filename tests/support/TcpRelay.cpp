@@ -170,7 +170,10 @@ void TcpRelay::pumpBytes(int client, int server) {
                     while (!m_stop && now.cutDataAfter < 0)
                         std::this_thread::sleep_for(std::chrono::milliseconds(tick));
                     reset(client);
-                    reset(server);
+                    if (now.serverSeesEnd)
+                        ::close(server);
+                    else
+                        reset(server);
                     return;
                 }
                 room = std::min<std::size_t>(room, static_cast<std::size_t>(std::max<qint64>(1, limit - passed)));
@@ -274,8 +277,15 @@ void TcpRelay::control(int client) {
                 broken = true;
                 break;
             }
+            if (line.startsWith("226") && (now.holdClosingReply || !now.closingReply.isEmpty()) && due()) {
+                if (now.holdClosingReply)
+                    continue;
+                line = now.closingReply + "\r\n";
+            }
             if (line.startsWith("227 ") || line.startsWith("229 "))
                 line = ownPort(line);
+            if (now.manyLines)
+                line = line.left(3) + "-first\r\n 226 is no end\r\n" + line;
             sendAll(client, line.constData(), static_cast<std::size_t>(line.size()));
         }
     }

@@ -26,6 +26,10 @@ public:
         qint64 stallDataAfter = -1; // bytes, then nothing goes on until the relay ends
         std::chrono::milliseconds delayReplies{0};
         bool loseClosingReply = false; // the 226 is swallowed and the control connection reset
+        bool holdClosingReply = false; // the 226 is swallowed and nothing else happens
+        QByteArray closingReply = {};  // comes in place of the 226
+        bool serverSeesEnd = false;    // with cutDataAfter: the server's side of the cut is an orderly end
+        bool manyLines = false;        // every reply comes in three lines
         bool refuseConnections = false;
         QByteArray command = {};   // with cutAtCommand or reply: "STOR"
         bool cutAtCommand = false; // the control connection is reset when the command comes, which is not passed on

@@ -104,6 +104,7 @@ public:
     }
     Result<QByteArray> fetch(const QString&) override { return noLine(); }
     Result<QByteArray> post(const QString&, const PostRequest&) override { return noLine(); }
+    Result<std::optional<qint64>> contentLength(const QString&) override { return noLine(); }
     Result<void> download(const QString&, const HostPath&) override { return noLine(); }
 
 private:

@@ -166,6 +166,14 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
     } cases[] = {
         {"clean", [](Line&) {}, SendingPhase::Success, 1, 3},
         {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, SendingPhase::Success, 1, 3},
+        {"an empty folder's listing is refused",
+         [](Line& line) {
+             line.remote();
+             line.lab.refusesEmptyListings = true;
+         },
+         SendingPhase::Success, 1, 3},
+        {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, SendingPhase::NotAll,
+         4, 3},
         {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, SendingPhase::NotAll, 4, 0},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, SendingPhase::NotAll, 4, 0},
         {"cut, and the remains can't be deleted",
@@ -219,6 +227,15 @@ TEST_F(FtpSenderTest, AnEmptyFolderOnTheServerCountsAsOneFile) {
     EXPECT_EQ(told.number(Incomplete), 3);
 }
 
+TEST_F(FtpSenderTest, ARefusedListingProvesNothingOnceAPutWasTried) {
+    lab.putFaults = {{QString(), FakeLab::always, -1}};
+    remote();
+    lab.refusesEmptyListings = true;
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::NotAll);
+    EXPECT_EQ(told.troubles.back().step, LineStep::List);
+    EXPECT_EQ(lists.List4Broken.count(), 1) << "the only put that was tried; its remains may stand there";
+}
+
 TEST_F(FtpSenderTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
     lab.folders[base][u"01a.jpp"_s] = "another's file";
     lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
@@ -233,17 +250,24 @@ TEST_F(FtpSenderTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
     EXPECT_EQ(remote()[u"01a.jpp"_s].size(), 350);
 }
 
-TEST_F(FtpSenderTest, AStopCountsAtEveryFileAndNothingIsSentTwice) {
+TEST_F(FtpSenderTest, AStopCutsTheFileInHandWhichCountsAsBrokenAndIsSentAgain) {
     for (const QString& stopAt : {names().first(), names().last()}) {
         Line line;
-        line.lab.onPut = [&](const QString& name) { line.sender.stop.StopFlag = name == stopAt; };
+        line.lab.onPut = [&](const QString& name) {
+            if (name == stopAt)
+                line.sender.stopNow();
+        };
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
         EXPECT_EQ(line.told.count(Stopped), 1);
+        EXPECT_EQ(line.told.troubles.size(), 0u) << "what a stop has cut is no trouble";
         EXPECT_EQ(line.lab.puts.size(), names().indexOf(stopAt) + 1);
+        EXPECT_EQ(line.sender.lists.List4Broken.items(), QStringList(path(stopAt)));
+        EXPECT_LT(line.remote()[stopAt].size(), stopAt.size() * 50);
         line.lab.onPut = {};
         line.sender.refill();
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
-        EXPECT_EQ(line.lab.puts, names());
+        EXPECT_EQ(line.lab.puts.size(), names().size() + 1);
+        EXPECT_EQ(line.remote()[stopAt].size(), stopAt.size() * 50);
     }
 }
 
@@ -256,7 +280,7 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
         line.lab.onConnect = [&](int number) {
             if (stoppedAt == 0 && line.told.count(in) > 0) {
                 stoppedAt = number;
-                line.sender.stop.StopFlag = true;
+                line.sender.stopNow();
             }
         };
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);

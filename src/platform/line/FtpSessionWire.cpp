@@ -4,6 +4,8 @@
 #include "common/HostFile.h"
 #include "platform/line/FtpListing.h"
 
+#include <QRegularExpression>
+
 #include <Poco/Exception.h>
 #include <Poco/Net/NetException.h>
 #include <Poco/Net/SocketAddress.h>
@@ -28,6 +30,18 @@ constexpr std::size_t chunk = 64 * 1024;
 
 Result<void> noFailure() {
     return {};
+}
+
+bool completed(int code) {
+    return code >= 200 && code <= 299;
+}
+
+// The refusal speaks of encryption, which these servers ask for before anything else.
+bool asksForEncryption(const QByteArray& text) {
+    static const QRegularExpression words(
+        QStringLiteral("\\b(tls|ssl|ftps|encrypt\\w*|cleartext|plain ftp|use auth)\\b"),
+        QRegularExpression::CaseInsensitiveOption);
+    return words.match(QString::fromLatin1(text)).hasMatch();
 }
 
 void sendAll(StreamSocket& socket, const char* bytes, std::size_t count) {
@@ -108,12 +122,11 @@ void FtpSessionWire::close() {
         return;
     m_open = false;
     try {
-        m_control.setSendTimeout(Poco::Timespan(1, 0));
-        sendAll(m_control, "QUIT\r\n", 6);
-        m_control.close();
-    } catch (const std::exception&) {
-        m_control = StreamSocket(); // a line that is gone needs no farewell
+        m_control.socket.setSendTimeout(Poco::Timespan(1, 0));
+        sendAll(m_control.socket, "QUIT\r\n", 6);
+    } catch (const std::exception&) { // a line that is gone needs no farewell
     }
+    m_control = {};
 }
 
 Result<QByteArray> FtpSessionWire::argumentBytes(const QString& argument) const {
@@ -126,10 +139,12 @@ Result<QByteArray> FtpSessionWire::argumentBytes(const QString& argument) const 
 
 void FtpSessionWire::send(const QByteArray& line) {
     const QByteArray whole = line + "\r\n";
-    sendAll(m_control, whole.constData(), static_cast<std::size_t>(whole.size()));
+    sendAll(m_control.socket, whole.constData(), static_cast<std::size_t>(whole.size()));
 }
 
 FtpSessionWire::Reply FtpSessionWire::readReply() {
+    // What came before a cut can still be read behind it.
+    m_call.check();
     Reply reply;
     for (;;) {
         for (qsizetype end = m_received.indexOf('\n'); end >= 0; end = m_received.indexOf('\n')) {
@@ -156,7 +171,7 @@ FtpSessionWire::Reply FtpSessionWire::readReply() {
         if (m_received.size() + reply.text.size() > longestReply)
             throw Poco::Net::NetException("a reply without an end");
         std::array<char, 4096> bytes;
-        const int count = m_control.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
+        const int count = m_control.socket.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
         if (count <= 0)
             throw Poco::Net::ConnectionResetException("the server closed the connection");
         m_received.append(bytes.data(), count);
@@ -175,23 +190,13 @@ Result<void> FtpSessionWire::open(const QString& host, const QString& user, cons
     m_host = host;
     m_channel = channel;
     return guarded([&]() -> Result<void> {
-        const std::string name = host.toStdString();
-        const bool withPort = name.find(':') != std::string::npos;
-        const SocketAddress address = withPort ? SocketAddress(name) : SocketAddress(name, ftpPort);
-        m_control.connect(address, m_limits.connect);
+        m_control = LineSocket(ResolvedAddress(host.toStdString(), ftpPort, m_call), m_call);
         m_open = true;
-        m_control.setReceiveTimeout(m_limits.silence);
-        m_control.setSendTimeout(m_limits.silence);
-        m_control.setNoDelay(true);
+        m_control.socket.setNoDelay(true);
         Reply greeting = readReply();
         while (greeting.code >= 100 && greeting.code < 200) // "ready in n minutes"
             greeting = readReply();
-        if (greeting.code < 200 || greeting.code > 299) {
-            const Failure failure = refused(greeting);
-            close();
-            return failure;
-        }
-        auto result = login(user, password);
+        auto result = completed(greeting.code) ? login(user, password) : refusedLogin(greeting);
         if (!result)
             close();
         return result;
@@ -208,9 +213,22 @@ Result<void> FtpSessionWire::login(const QString& user, const QString& password)
     Reply reply = ask("USER " + *userBytes);
     if (reply.code == 331)
         reply = ask("PASS " + *passwordBytes);
-    if (reply.code < 200 || reply.code > 299)
-        return refused(reply);
+    if (!completed(reply.code))
+        return refusedLogin(reply);
+    const auto home = askDirectory();
+    if (!home && !m_open)
+        return home.failure();
+    m_home = home ? *home : QString();
+    if (m_home.endsWith(u'/') || m_home.endsWith(u'\\'))
+        m_home.chop(1);
     return {};
+}
+
+Failure FtpSessionWire::refusedLogin(const Reply& reply) {
+    Failure failure = refused(reply);
+    if (asksForEncryption(reply.text))
+        failure = {Failure::Kind::Unsupported, QStringLiteral("this server wants encryption: ") + failure.message};
+    return failure;
 }
 
 Result<void> FtpSessionWire::command(const char* word, const QString& argument) {
@@ -219,31 +237,59 @@ Result<void> FtpSessionWire::command(const char* word, const QString& argument) 
         return bytes.failure();
     return guarded([&]() -> Result<void> {
         const Reply reply = ask(QByteArray(word) + ' ' + *bytes);
-        return reply.code >= 200 && reply.code <= 299 ? noFailure() : refused(reply);
+        return completed(reply.code) ? noFailure() : refused(reply);
     });
 }
 
+Result<QString> FtpSessionWire::askDirectory() {
+    const Reply reply = ask("PWD");
+    if (reply.code != 257)
+        return refused(reply);
+    // 257 "/a ""quoted"" name" and a remark
+    const qsizetype open = reply.text.indexOf('"');
+    QByteArray path;
+    for (qsizetype at = open + 1; open >= 0 && at < reply.text.size(); ++at) {
+        if (reply.text[at] == '"') {
+            if (at + 1 >= reply.text.size() || reply.text[at + 1] != '"')
+                return AnsiCodePage::decode(path);
+            ++at;
+        }
+        path += reply.text[at];
+    }
+    return refused(reply);
+}
+
+// A server that is not closed in to the account's folder tells the whole path of its own disk.
 Result<QString> FtpSessionWire::currentDirectory() {
     return guarded([&]() -> Result<QString> {
-        const Reply reply = ask("PWD");
-        if (reply.code != 257)
-            return refused(reply);
-        // 257 "/a ""quoted"" name" and a remark
-        const qsizetype open = reply.text.indexOf('"');
-        QByteArray path;
-        for (qsizetype at = open + 1; open >= 0 && at < reply.text.size(); ++at) {
-            if (reply.text[at] == '"') {
-                if (at + 1 >= reply.text.size() || reply.text[at + 1] != '"')
-                    return AnsiCodePage::decode(path);
-                ++at;
-            }
-            path += reply.text[at];
-        }
-        return refused(reply);
+        const auto path = askDirectory();
+        if (!path || m_home.isEmpty() || !path->startsWith(m_home))
+            return path;
+        QString below = path->mid(m_home.size());
+        if (!m_home.contains(u'/'))
+            below.replace(u'\\', u'/');
+        return below.isEmpty() ? QStringLiteral("/") : below.startsWith(u'/') ? Result<QString>(below) : path;
     });
 }
 
-Result<StreamSocket> FtpSessionWire::openPassive() {
+Result<void> FtpSessionWire::changeDirectory(const QString& directory) {
+    const bool fromHome = directory.startsWith(u'/') && !m_home.isEmpty();
+    if (!fromHome)
+        return command("CWD", directory);
+    return command("CWD", directory.size() == 1 ? m_home : m_home + directory);
+}
+
+Result<void> FtpSessionWire::setType(FtpType type) {
+    if (m_typeSet == type)
+        return {};
+    const Reply reply = ask(type == FtpType::Ascii ? "TYPE A" : "TYPE I");
+    if (!completed(reply.code))
+        return refused(reply);
+    m_typeSet = type;
+    return {};
+}
+
+Result<SocketAddress> FtpSessionWire::openPassive() {
     int port = 0;
     if (m_extendedPassive) {
         const Reply reply = ask("EPSV");
@@ -258,13 +304,11 @@ Result<StreamSocket> FtpSessionWire::openPassive() {
         if (port == 0)
             return refused(reply);
     }
-    StreamSocket data;
-    data.connect(SocketAddress(m_control.peerAddress().host(), static_cast<Poco::UInt16>(port)), m_limits.connect);
-    return data;
+    return SocketAddress(m_control.socket.peerAddress().host(), static_cast<Poco::UInt16>(port));
 }
 
 Result<Poco::Net::ServerSocket> FtpSessionWire::openActive() {
-    const auto own = m_control.address();
+    const auto own = m_control.socket.address();
     Poco::Net::ServerSocket listener;
     listener.bind(SocketAddress(own.host(), 0), true);
     listener.listen(1);
@@ -279,64 +323,72 @@ Result<Poco::Net::ServerSocket> FtpSessionWire::openActive() {
     return listener;
 }
 
-Result<void> FtpSessionWire::transfer(const QByteArray& line, const Transfer& move) {
-    // Type ASCII on the wire, and the bytes as they are: what the lab's server expects, and what leaves a picture whole
-    // there.
-    if (!m_typeSet) {
-        const Reply type = ask("TYPE A");
-        if (type.code < 200 || type.code > 299)
-            return refused(type);
-        m_typeSet = true;
-    }
-    StreamSocket data;
+Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction direction, const Transfer& move) {
+    m_transferCode = 0;
+    if (const auto typed = setType(m_type); !typed)
+        return typed;
+    LineSocket data;
     Poco::Net::ServerSocket listener;
+    LineAbort::Watch listening;
     if (m_channel == Internet::DataChannel::Passive) {
-        auto passive = openPassive();
-        if (!passive)
-            return passive.failure();
-        data = *passive;
+        const auto address = openPassive();
+        if (!address)
+            return address.failure();
+        data = LineSocket(*address, m_call);
     } else {
         auto active = openActive();
         if (!active)
             return active.failure();
         listener = *active;
+        listening = LineAbort::Watch(m_call.line(), listener);
     }
     const Reply start = ask(line);
-    if (start.code >= 200)
+    if (start.code >= 200) {
+        m_transferCode = start.code;
         return refused(start);
-    if (m_channel == Internet::DataChannel::Active) {
-        if (!listener.poll(m_limits.connect, Poco::Net::Socket::SELECT_READ))
-            throw Poco::TimeoutException();
-        data = listener.acceptConnection();
     }
-    data.setReceiveTimeout(m_limits.silence);
-    data.setSendTimeout(m_limits.silence);
+    if (m_channel == Internet::DataChannel::Active) {
+        m_call.check();
+        if (!listener.poll(m_call.limits().connect, Poco::Net::Socket::SELECT_READ))
+            throw Poco::TimeoutException();
+        data.socket = listener.acceptConnection();
+        data.watch = LineAbort::Watch(m_call.line(), data.socket);
+        data.socket.setReceiveTimeout(m_call.limits().silence);
+        data.socket.setSendTimeout(m_call.limits().silence);
+        m_call.check();
+    }
 
     Result<void> moved;
     try {
-        moved = move(data);
+        moved = move(data.socket);
     } catch (const Poco::TimeoutException&) {
         return broken(Failure::Kind::TimedOut, QStringLiteral("the transfer stood still"));
     } catch (const Poco::Exception& exception) {
         moved = Failure{Failure::Kind::Disconnected, QStringLiteral("ftp %1: the transfer was cut: %2")
                                                          .arg(m_host, QString::fromStdString(exception.displayText()))};
-        data.close();
     }
+    // Some servers wait for the end of a download's connection before they say that all has gone.
+    if (!moved || direction == Direction::Down)
+        data.close();
     if (!moved) {
         // The server's own reason, if it still gives one, says more than a cut line: a full disk, a quota.
         const Failure cut = moved.failure();
-        data.close();
-        m_control.setReceiveTimeout(std::min(m_limits.silence, Poco::Timespan(5, 0)));
+        m_control.socket.setReceiveTimeout(std::min(m_call.limits().silence, Poco::Timespan(5, 0)));
         const Reply reason = readReply();
-        m_control.setReceiveTimeout(m_limits.silence);
+        m_control.socket.setReceiveTimeout(m_call.limits().silence);
         return reason.code >= 400 ? refused(reason) : cut;
     }
     const Reply end = readReply();
-    if (end.code < 200 || end.code > 299)
+    m_transferCode = end.code;
+    if (!completed(end.code))
         return refused(end);
-    // A line that was cut behind the last bytes leaves a server that took what it had for the whole and says so.
+    return direction == Direction::Up ? endOfPut(data.socket) : noFailure();
+}
+
+// A line that was cut behind the last bytes leaves a server that took what it had for the whole and says so.
+Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
     std::array<char, 16> rest;
-    data.setReceiveTimeout(std::min(m_limits.silence, Poco::Timespan(2, 0)));
+    data.setReceiveTimeout(std::min(m_call.limits().silence, Poco::Timespan(2, 0)));
     try {
         while (data.receiveBytes(rest.data(), static_cast<int>(rest.size())) > 0) {
         }
@@ -346,6 +398,7 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, const Transfer& mo
         return Failure{Failure::Kind::Disconnected,
                        QStringLiteral("ftp %1: the transfer was cut at its end").arg(m_host)};
     }
+    m_call.check();
     return {};
 }
 
@@ -357,7 +410,7 @@ Result<void> FtpSessionWire::put(const HostPath& local, const QString& remoteNam
     if (!source)
         return source.failure();
     return guarded([&] {
-        return transfer("STOR " + *name, [&](StreamSocket& data) -> Result<void> {
+        return transfer("STOR " + *name, Direction::Up, [&](StreamSocket& data) -> Result<void> {
             std::vector<char> bytes(chunk);
             for (;;) {
                 const auto count = readSome(*source, bytes.data(), bytes.size(), toText(local));
@@ -383,7 +436,7 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
     if (content.failed())
         return content.commit();
     auto received = guarded([&] {
-        return transfer("RETR " + *name, [&](StreamSocket& data) -> Result<void> {
+        return transfer("RETR " + *name, Direction::Down, [&](StreamSocket& data) -> Result<void> {
             std::vector<char> bytes(chunk);
             for (;;) {
                 const int count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
@@ -398,13 +451,13 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
     return received ? content.commit() : received;
 }
 
-Result<std::vector<FtpEntry>> FtpSessionWire::list(const QString& pattern) {
+Result<FtpListing> FtpSessionWire::list(const QString& pattern, EmptyFolder empty) {
     const auto bytes = argumentBytes(pattern);
     if (!bytes)
         return bytes.failure();
     QByteArray listing;
     const auto received = guarded([&] {
-        return transfer(*bytes == "*.*" ? QByteArray("LIST") : "LIST " + *bytes,
+        return transfer(*bytes == "*.*" ? QByteArray("LIST") : "LIST " + *bytes, Direction::Down,
                         [&](StreamSocket& data) -> Result<void> {
                             std::vector<char> part(chunk);
                             for (;;) {
@@ -418,9 +471,29 @@ Result<std::vector<FtpEntry>> FtpSessionWire::list(const QString& pattern) {
                             }
                         });
     });
-    if (!received)
+    const bool refusedAsEmpty =
+        empty == EmptyFolder::MayBeRefused && listing.isEmpty() && (m_transferCode == 450 || m_transferCode == 550);
+    if (!received && !refusedAsEmpty)
         return received.failure();
     return ParseFtpListing(listing);
+}
+
+Result<std::optional<qint64>> FtpSessionWire::length(const QString& remoteName) {
+    using Length = std::optional<qint64>;
+    const auto name = argumentBytes(remoteName);
+    if (!name)
+        return name.failure();
+    return guarded([&]() -> Result<Length> {
+        const auto typed = setType(FtpType::Image);
+        if (!typed)
+            return m_open ? Result<Length>(Length()) : typed.failure();
+        const Reply reply = ask("SIZE " + *name);
+        if (reply.code == 421)
+            return refused(reply);
+        bool known = false;
+        const qint64 bytes = reply.text.mid(4).trimmed().toLongLong(&known);
+        return reply.code == 213 && known && bytes >= 0 ? Length(bytes) : Length();
+    });
 }
 
 QString FtpSessionWire::lastResponse() const {

@@ -1,13 +1,13 @@
 #pragma once
 
 #include "platform/line/Internet.h"
-#include "platform/line/TimeLimits.h"
+#include "platform/line/LineSocket.h"
 
 #include <Poco/Net/ServerSocket.h>
 #include <Poco/Net/StreamSocket.h>
 
 #include <functional>
-#include <string>
+#include <optional>
 
 namespace lumora {
 
@@ -16,18 +16,21 @@ namespace lumora {
 // Used by one thread at a time; every call blocks.
 class FtpSessionWire {
 public:
-    explicit FtpSessionWire(TimeLimits limits)
-        : m_limits(limits) {}
+    FtpSessionWire(const LineCall& call, FtpType type)
+        : m_call(call)
+        , m_type(type) {}
 
     Result<void> open(const QString& host, const QString& user, const QString& password, Internet::DataChannel channel);
     void close();
 
     // A command of one word with an argument; the answer must be of 200 to 299.
     Result<void> command(const char* word, const QString& argument);
+    Result<void> changeDirectory(const QString& directory);
     Result<QString> currentDirectory();
     Result<void> put(const HostPath& local, const QString& remoteName);
     Result<void> get(const QString& remoteName, const HostPath& local);
-    Result<std::vector<FtpEntry>> list(const QString& pattern);
+    Result<FtpListing> list(const QString& pattern, EmptyFolder empty);
+    Result<std::optional<qint64>> length(const QString& remoteName);
 
     QString lastResponse() const;
 
@@ -48,19 +51,28 @@ private:
     auto guarded(Step step) -> decltype(step());
 
     Result<void> login(const QString& user, const QString& password);
-    Result<Poco::Net::StreamSocket> openPassive();
+    Failure refusedLogin(const Reply& reply);
+    // What the server answers to PWD.
+    Result<QString> askDirectory();
+    Result<void> setType(FtpType type);
+    Result<Poco::Net::SocketAddress> openPassive();
     Result<Poco::Net::ServerSocket> openActive();
+    enum class Direction { Up, Down };
     // Opens a data connection, gives the command, moves the bytes and judges the reply that closes the transfer.
-    Result<void> transfer(const QByteArray& line, const Transfer& move);
+    Result<void> transfer(const QByteArray& line, Direction direction, const Transfer& move);
+    Result<void> endOfPut(Poco::Net::StreamSocket& data);
 
-    TimeLimits m_limits;
-    Poco::Net::StreamSocket m_control;
+    LineCall m_call;
+    FtpType m_type;
+    LineSocket m_control;
     QString m_host;
     QByteArray m_received; // bytes behind the reply that was read last
     Reply m_last;
+    QString m_home;         // the login folder as the server tells it, without a slash at its end; empty: the root
+    int m_transferCode = 0; // of the reply that refused or closed the last transfer; 0 where it did not come so far
     Internet::DataChannel m_channel = Internet::DataChannel::Passive;
     bool m_open = false;
-    bool m_typeSet = false;
+    std::optional<FtpType> m_typeSet;
     bool m_extendedPassive = true; // until the server has refused it once
 };
 

@@ -7,7 +7,6 @@
 #include <Poco/Net/HTTPClientSession.h>
 #include <Poco/Net/HTTPRequest.h>
 #include <Poco/Net/HTTPResponse.h>
-#include <Poco/Net/SocketAddress.h>
 
 #include <algorithm>
 #include <array>
@@ -43,40 +42,86 @@ Result<Address> addressOf(const QString& url) {
     return address;
 }
 
-// A numeric host of the newer kind has colons of its own, in brackets.
-std::string withPort(const std::string& host) {
-    const std::size_t name = host.rfind(']');
-    return host.find(':', name == std::string::npos ? 0 : name) == std::string::npos ? host + ":80" : host;
-}
+constexpr Poco::UInt16 httpPort = 80;
+constexpr int mostRedirects = 5;
 
 using Request = Poco::Net::HTTPRequest;
 using Sending = std::function<void(std::ostream&)>;
 
-// One request and its answer. send writes the request's body.
-Result<int> call(const QString& url, const char* method, const std::string& version, const TimeLimits& limits,
-                 const std::function<void(Request&)>& fill, const Sending& send, const BodySink& sink) {
+// What is asked, of whichever address.
+struct Asking {
+    std::string method;
+    std::string version = Request::HTTP_1_1;
+    std::function<void(Request&)> fill = [](Request&) {};
+    Sending send = [](std::ostream&) {}; // writes the request's body
+};
+
+struct Answered : HttpAnswer {
+    std::optional<QString> next; // where a redirect leads that is to be followed
+};
+
+bool isRedirect(int status) {
+    return (status >= 301 && status <= 303) || status == 307 || status == 308;
+}
+
+QString hostAndPort(const std::string& host) {
+    const QString text = QString::fromStdString(host).toLower();
+    return text.endsWith(QStringLiteral(":80")) ? text.chopped(3) : text;
+}
+
+// Where a redirect leads on the same host and port; no value where it leads elsewhere.
+std::optional<QString> redirectTarget(const Address& from, const QString& location) {
+    const QString scheme = QStringLiteral("http://");
+    const QString host = scheme + QString::fromStdString(from.host);
+    QString url = location.left(location.indexOf(u'#'));
+    if (url.startsWith(QStringLiteral("//"))) {
+        url.prepend(QStringLiteral("http:"));
+    } else if (url.startsWith(u'/')) {
+        url.prepend(host);
+    } else if (!url.contains(QStringLiteral("://"))) {
+        const QByteArray path = from.target.left(from.target.indexOf('?'));
+        url = host + AnsiCodePage::decode(path.left(path.lastIndexOf('/') + 1)) + url;
+    }
     const auto to = addressOf(url);
-    if (!to)
-        return to.failure();
+    return to && hostAndPort(to->host) == hostAndPort(from.host) ? std::optional(url) : std::nullopt;
+}
+
+// One request and its answer. The body of a redirect is not taken.
+Result<Answered> askOnce(const QString& url, const Address& to, const Asking& asking, const LineCall& line,
+                         const BodySink& sink) {
     try {
-        const Poco::Net::SocketAddress address(withPort(to->host));
-        Poco::Net::HTTPClientSession session(address);
-        session.setTimeout(limits.connect, limits.silence, limits.silence);
+        LineSocket socket(ResolvedAddress(to.host, httpPort, line), line);
+        Poco::Net::HTTPClientSession session(socket.socket);
         session.setKeepAlive(false);
-        Request request(method, to->target.toStdString(), version);
-        request.setHost(to->host);
+        Request request(asking.method, to.target.toStdString(), asking.version);
+        request.setHost(to.host);
         request.set("User-Agent", "vb wininet");
         request.set("Cache-Control", "no-cache");
         request.set("Pragma", "no-cache");
-        fill(request);
+        asking.fill(request);
         std::ostream& out = session.sendRequest(request);
-        send(out);
+        asking.send(out);
         out.flush();
         // The streams keep what went wrong on the line to themselves.
         if (const Poco::Exception* lost = session.networkException())
             lost->rethrow();
         Poco::Net::HTTPResponse response;
         std::istream& body = session.receiveResponse(response);
+        Answered answer;
+        answer.status = static_cast<int>(response.getStatus());
+        if (response.hasContentLength())
+            answer.length = response.getContentLength64();
+        if (isRedirect(answer.status)) {
+            const bool post = asking.method == Request::HTTP_POST;
+            if (response.has("Location") && (!post || answer.status >= 307))
+                answer.next =
+                    redirectTarget(to, AnsiCodePage::decode(QByteArray::fromStdString(response.get("Location"))));
+            if (answer.next)
+                return answer;
+            if (post)
+                return callFailure(Failure::Kind::Refused, url,
+                                   QStringLiteral("the server answered %1 and did not take it").arg(answer.status));
+        }
         std::vector<char> bytes(16 * 1024);
         std::streamsize received = 0;
         while (body.good()) {
@@ -87,10 +132,10 @@ Result<int> call(const QString& url, const char* method, const std::string& vers
         }
         if (const Poco::Exception* lost = session.networkException())
             lost->rethrow();
-        const std::streamsize announced = response.hasContentLength() ? response.getContentLength64() : received;
-        if (received < announced)
+        line.check();
+        if (asking.method != Request::HTTP_HEAD && received < answer.length.value_or(received))
             return callFailure(Failure::Kind::Disconnected, url, QStringLiteral("the answer was cut short"));
-        return static_cast<int>(response.getStatus());
+        return answer;
     } catch (const Poco::TimeoutException&) {
         return callFailure(Failure::Kind::TimedOut, url, QStringLiteral("no answer within the time limit"));
     } catch (const Poco::Exception& exception) {
@@ -98,6 +143,21 @@ Result<int> call(const QString& url, const char* method, const std::string& vers
     } catch (const std::exception& exception) {
         return callFailure(Failure::Kind::Other, url, QString::fromLocal8Bit(exception.what()));
     }
+}
+
+Result<HttpAnswer> ask(QString url, const Asking& asking, const LineCall& line, const BodySink& sink) {
+    for (int redirects = 0; redirects <= mostRedirects; ++redirects) {
+        const auto to = addressOf(url);
+        if (!to)
+            return to.failure();
+        const auto answer = askOnce(url, *to, asking, line, sink);
+        if (!answer)
+            return answer.failure();
+        if (!answer->next)
+            return HttpAnswer(*answer);
+        url = *answer->next;
+    }
+    return callFailure(Failure::Kind::Refused, url, QStringLiteral("the server redirects without an end"));
 }
 
 } // namespace
@@ -115,14 +175,20 @@ QByteArray HttpTarget(const QString& pathAndQuery) {
     return target;
 }
 
-Result<int> HttpGet(const QString& url, const TimeLimits& limits, const BodySink& sink) {
-    return call(
-        url, Request::HTTP_GET.c_str(), Request::HTTP_1_1, limits, [](Request&) {}, [](std::ostream&) {}, sink);
+Result<HttpAnswer> HttpGet(const QString& url, const LineCall& line, const BodySink& sink) {
+    return ask(url, {.method = Request::HTTP_GET}, line, sink);
 }
 
-Result<int> HttpPost(const QString& url, const PostRequest& post, const TimeLimits& limits, const BodySink& sink) {
+Result<HttpAnswer> HttpHead(const QString& url, const LineCall& line) {
+    return ask(url, {.method = Request::HTTP_HEAD}, line, [](const char*, std::size_t) { return true; });
+}
+
+Result<HttpAnswer> HttpPost(const QString& url, const PostRequest& post, const LineCall& line, const BodySink& sink) {
     const qint64 announced = std::max<qint64>(post.announcedLength, post.body.size());
-    const auto fill = [&](Request& request) {
+    Asking asking{.method = Request::HTTP_POST};
+    if (post.version == PostRequest::Version::Http10)
+        asking.version = Request::HTTP_1_0;
+    asking.fill = [&](Request& request) {
         request.setContentType(post.contentType.toStdString());
         request.setContentLength64(announced);
         if (!post.user.isEmpty() && !post.password.isEmpty())
@@ -130,15 +196,14 @@ Result<int> HttpPost(const QString& url, const PostRequest& post, const TimeLimi
                                             AnsiCodePage::encode(post.password).toStdString())
                 .authenticate(request);
     };
-    const auto send = [&](std::ostream& out) {
+    asking.send = [&](std::ostream& out) {
         for (qint64 at = 0; at < post.body.size() && out.good(); at += pieceOfBody)
             out.write(post.body.constData() + at, std::min<qint64>(pieceOfBody, post.body.size() - at));
         static constexpr std::array<char, pieceOfBody> zeros{};
         for (qint64 left = announced - post.body.size(); left > 0 && out.good(); left -= pieceOfBody)
             out.write(zeros.data(), std::min<qint64>(pieceOfBody, left));
     };
-    const auto& version = post.version == PostRequest::Version::Http10 ? Request::HTTP_1_0 : Request::HTTP_1_1;
-    return call(url, Request::HTTP_POST.c_str(), version, limits, fill, send, sink);
+    return ask(url, asking, line, sink);
 }
 
 } // namespace lumora

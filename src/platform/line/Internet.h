@@ -7,6 +7,7 @@
 #include <QString>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
 // The calls that the transfer makes over the line, in the manner of a session: open, connect, walk, put, list. Each
@@ -15,30 +16,50 @@
 // holds CR, LF or NUL is refused before anything is sent.
 namespace lumora {
 
+class EventPump;
+
 struct FtpEntry {
     QString name;
     bool folder = false;
+    std::optional<qint64> length = {}; // bytes; of a file, where the listing tells it
 };
+
+// The answer to a listing.
+struct FtpListing {
+    std::vector<FtpEntry> entries; // in the server's order, "." and ".." as they come
+    QString unread; // the first line that could not be read; with one, a name that is missing proves nothing
+};
+
+// The type of a transfer on the wire. The bytes that are written are the same under both.
+enum class FtpType { Ascii, Image };
+
+// How a server may tell that a folder is empty: by a listing that ends without an entry, or by refusing LIST with 450
+// or 550 as well, which is also the answer for a folder that can't be read.
+enum class EmptyFolder { IsListed, MayBeRefused };
 
 // One connection to an FTP server, open until it is destroyed.
 class FtpConnection {
 public:
     virtual ~FtpConnection() = default;
 
-    // Relative to the current directory unless it begins at the root.
+    // Relative to the current directory unless it begins at the root, which is the folder that the login leads to.
     virtual Result<void> setCurrentDirectory(const QString& directory) = 0;
+    // From the login folder on, with a slash in front.
     virtual Result<QString> currentDirectory() = 0;
     virtual Result<void> makeDirectory(const QString& name) = 0;
 
-    // Transfer type ASCII on the wire, bytes as they are: the lab's server takes them so, and pictures survive only
-    // that way.
+    // Under the transfer type of the line, bytes as they are.
     virtual Result<void> put(const HostPath& local, const QString& remoteName) = 0;
     virtual Result<void> get(const QString& remoteName, const HostPath& local) = 0;
     virtual Result<void> remove(const QString& remoteName) = 0;
 
-    // The entries of the current directory, "." and ".." as the server gives them. The pattern "*.*" means every name
-    // and is sent as a plain LIST, since a server would otherwise hide the names without a dot.
-    virtual Result<std::vector<FtpEntry>> list(const QString& pattern) = 0;
+    // What the current directory holds. The pattern "*.*" means every name and is sent as a plain LIST, since a server
+    // would otherwise hide the names without a dot.
+    virtual Result<FtpListing> list(const QString& pattern, EmptyFolder empty = EmptyFolder::IsListed) = 0;
+
+    // The length of a file in bytes, asked by SIZE under type image; no value where the server has no such file or does
+    // not tell.
+    virtual Result<std::optional<qint64>> length(const QString& remoteName) = 0;
 
     // The server's last reply, all lines.
     virtual QString lastResponse() const = 0;
@@ -69,12 +90,24 @@ public:
     virtual Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user,
                                                               const QString& password, DataChannel channel) = 0;
 
-    // GET, past every cache. The URL goes out as it stands, in the ANSI code page, only a blank as %20; CR, LF and NUL
-    // count as blanks and "#" does not cut. The answer's body whatever the status is.
+    // Cuts every connection that stands; each call under way fails at once, and a put that was cut is a broken put.
+    // From any thread. Later calls are not concerned.
+    virtual void abort() {}
+    // While a pump is given, a call that waits on its thread pumps, so that a click may abort it.
+    virtual void pumpWhileWaiting(EventPump*) {}
+
+    // GET, past every cache. A redirect to the same host is followed, at most five in a row. The URL goes out as it
+    // stands, in the ANSI code page, only a blank as %20; CR, LF and NUL count as blanks and "#" does not cut. The
+    // answer's body whatever the status is.
     virtual Result<QByteArray> fetch(const QString& url) = 0;
 
-    // POST to an address that goes out as that of fetch does. The answer's body whatever the status is.
+    // POST to an address that goes out as that of fetch does. The answer's body whatever the status is, but for a
+    // redirect: 307 and 308 to the same host repeat the POST, any other is a failure.
     virtual Result<QByteArray> post(const QString& url, const PostRequest& request) = 0;
+
+    // The length in bytes that the server tells of an address, asked by HEAD; no value where it does not answer 200 to
+    // 299 or tells none.
+    virtual Result<std::optional<qint64>> contentLength(const QString& url) = 0;
 
     // GET into a file, written whole or not at all; an answer of another status than 200 to 299, and one
     // without end, is a failure and leaves no file.

@@ -11,47 +11,82 @@
 #include <utility>
 
 namespace lumora {
+struct PocoInternet::Line {
+    LineAbort abort;
+    EventPump* pump = nullptr;
+};
+
 namespace {
 
 class WireConnection : public FtpConnection {
+    template <class Call>
+    auto run(Call call) {
+        const std::shared_ptr<FtpSessionWire> wire = m_wire;
+        return RunBlocking([&] { return call(*wire); }, m_line->pump);
+    }
+
 public:
-    explicit WireConnection(std::unique_ptr<FtpSessionWire> wire)
-        : m_wire(std::move(wire)) {}
+    WireConnection(std::shared_ptr<PocoInternet::Line> line, std::shared_ptr<FtpSessionWire> wire)
+        : m_line(std::move(line))
+        , m_wire(std::move(wire)) {}
     ~WireConnection() override {
-        RunBlocking([this] {
-            m_wire->close();
-            return true;
-        });
+        // Closed by a click inside a call, which ends by this.
+        if (m_wire.use_count() > 1)
+            m_line->abort.abort();
+        else
+            RunBlocking([this] {
+                m_wire->close();
+                return true;
+            });
     }
 
     Result<void> setCurrentDirectory(const QString& directory) override {
-        return RunBlocking([&] { return m_wire->command("CWD", directory); });
+        return run([&](FtpSessionWire& wire) { return wire.changeDirectory(directory); });
     }
     Result<QString> currentDirectory() override {
-        return RunBlocking([&] { return m_wire->currentDirectory(); });
+        return run([](FtpSessionWire& wire) { return wire.currentDirectory(); });
     }
     Result<void> makeDirectory(const QString& name) override {
-        return RunBlocking([&] { return m_wire->command("MKD", name); });
+        return run([&](FtpSessionWire& wire) { return wire.command("MKD", name); });
     }
     Result<void> put(const HostPath& local, const QString& remoteName) override {
-        return RunBlocking([&] { return m_wire->put(local, remoteName); });
+        return run([&](FtpSessionWire& wire) { return wire.put(local, remoteName); });
     }
     Result<void> get(const QString& remoteName, const HostPath& local) override {
-        return RunBlocking([&] { return m_wire->get(remoteName, local); });
+        return run([&](FtpSessionWire& wire) { return wire.get(remoteName, local); });
     }
     Result<void> remove(const QString& remoteName) override {
-        return RunBlocking([&] { return m_wire->command("DELE", remoteName); });
+        return run([&](FtpSessionWire& wire) { return wire.command("DELE", remoteName); });
     }
-    Result<std::vector<FtpEntry>> list(const QString& pattern) override {
-        return RunBlocking([&] { return m_wire->list(pattern); });
+    Result<FtpListing> list(const QString& pattern, EmptyFolder empty) override {
+        return run([&](FtpSessionWire& wire) { return wire.list(pattern, empty); });
+    }
+    Result<std::optional<qint64>> length(const QString& remoteName) override {
+        return run([&](FtpSessionWire& wire) { return wire.length(remoteName); });
     }
     QString lastResponse() const override { return m_wire->lastResponse(); }
 
 private:
-    std::unique_ptr<FtpSessionWire> m_wire;
+    std::shared_ptr<PocoInternet::Line> m_line;
+    std::shared_ptr<FtpSessionWire> m_wire;
 };
 
 } // namespace
+
+PocoInternet::PocoInternet(TimeLimits limits, FtpType type)
+    : m_limits(limits)
+    , m_type(type)
+    , m_line(std::make_shared<Line>()) {}
+
+PocoInternet::~PocoInternet() = default;
+
+void PocoInternet::abort() {
+    m_line->abort.abort();
+}
+
+void PocoInternet::pumpWhileWaiting(EventPump* pump) {
+    m_line->pump = pump;
+}
 
 bool PocoInternet::connectedState() const {
     ifaddrs* all = nullptr;
@@ -69,55 +104,77 @@ bool PocoInternet::connectedState() const {
 
 Result<std::unique_ptr<FtpConnection>> PocoInternet::connectFtp(const QString& host, const QString& user,
                                                                 const QString& password, DataChannel channel) {
-    auto wire = std::make_unique<FtpSessionWire>(m_limits);
-    const auto opened = RunBlocking([&] { return wire->open(host, user, password, channel); });
+    const auto line = m_line;
+    const auto wire = std::make_shared<FtpSessionWire>(LineCall(m_limits, line->abort), m_type);
+    const auto opened = RunBlocking([&] { return wire->open(host, user, password, channel); }, line->pump);
     if (!opened)
         return opened.failure();
-    return std::unique_ptr<FtpConnection>(std::make_unique<WireConnection>(std::move(wire)));
+    return std::unique_ptr<FtpConnection>(std::make_unique<WireConnection>(line, wire));
 }
 
 namespace {
 
 // The body of an answer, kept whole.
 template <class Call>
-Result<QByteArray> bodyOf(Call call) {
-    return RunBlocking([&]() -> Result<QByteArray> {
-        QByteArray body;
-        const auto status = call([&](const char* bytes, std::size_t count) {
-            body.append(bytes, static_cast<qsizetype>(count));
-            return body.size() <= largestFetchedBody;
-        });
-        if (!status)
-            return status.failure();
-        return body;
-    });
+Result<QByteArray> bodyOf(EventPump* pump, Call call) {
+    return RunBlocking(
+        [&]() -> Result<QByteArray> {
+            QByteArray body;
+            const auto answer = call([&](const char* bytes, std::size_t count) {
+                body.append(bytes, static_cast<qsizetype>(count));
+                return body.size() <= largestFetchedBody;
+            });
+            if (!answer)
+                return answer.failure();
+            return body;
+        },
+        pump);
 }
 
 } // namespace
 
 Result<QByteArray> PocoInternet::fetch(const QString& url) {
-    return bodyOf([&](const BodySink& sink) { return HttpGet(url, m_limits, sink); });
+    const LineCall line(m_limits, m_line->abort);
+    return bodyOf(m_line->pump, [&](const BodySink& sink) { return HttpGet(url, line, sink); });
 }
 
 Result<QByteArray> PocoInternet::post(const QString& url, const PostRequest& request) {
-    return bodyOf([&](const BodySink& sink) { return HttpPost(url, request, m_limits, sink); });
+    const LineCall line(m_limits, m_line->abort);
+    return bodyOf(m_line->pump, [&](const BodySink& sink) { return HttpPost(url, request, line, sink); });
+}
+
+Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {
+    using Length = std::optional<qint64>;
+    const LineCall line(m_limits, m_line->abort);
+    return RunBlocking(
+        [&]() -> Result<Length> {
+            const auto answer = HttpHead(url, line);
+            if (!answer)
+                return answer.failure();
+            return answer->good() ? answer->length : Length();
+        },
+        m_line->pump);
 }
 
 Result<void> PocoInternet::download(const QString& url, const HostPath& target) {
-    return RunBlocking([&]() -> Result<void> {
-        NewContent content(target, toText(target));
-        qint64 taken = 0;
-        const auto status = HttpGet(url, m_limits, [&](const char* bytes, std::size_t count) {
-            content.append(bytes, count);
-            taken += static_cast<qint64>(count);
-            return !content.failed() && taken <= largestDownload;
-        });
-        if (!status && !content.failed())
-            return status.failure();
-        if (status && (*status < 200 || *status > 299))
-            return Failure{Failure::Kind::Refused, QStringLiteral("%1: the server answered %2").arg(url).arg(*status)};
-        return content.commit();
-    });
+    const LineCall line(m_limits, m_line->abort);
+    return RunBlocking(
+        [&]() -> Result<void> {
+            NewContent content(target, toText(target));
+            qint64 taken = 0;
+            const auto answer = HttpGet(url, line, [&](const char* bytes, std::size_t count) {
+                content.append(bytes, count);
+                taken += static_cast<qint64>(count);
+                return !content.failed() && taken <= largestDownload;
+            });
+            if (!answer && !content.failed())
+                return answer.failure();
+            if (answer && !answer->good())
+                return Failure{Failure::Kind::Refused,
+                               QStringLiteral("%1: the server answered %2").arg(url).arg(answer->status)};
+            return content.commit();
+        },
+        m_line->pump);
 }
 
 } // namespace lumora

@@ -8,20 +8,28 @@ namespace lumora {
 // The line of the running program.
 class PocoInternet : public Internet {
 public:
-    explicit PocoInternet(TimeLimits limits = {})
-        : m_limits(limits) {}
+    explicit PocoInternet(TimeLimits limits = {}, FtpType type = FtpType::Ascii);
+    ~PocoInternet() override;
 
     bool open() override { return connectedState(); }
     // An interface with an address is up; which net it leads to is for the calls to find out.
     bool connectedState() const override;
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
+    void abort() override;
+    void pumpWhileWaiting(EventPump* pump) override;
     Result<QByteArray> fetch(const QString& url) override;
     Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<std::optional<qint64>> contentLength(const QString& url) override;
     Result<void> download(const QString& url, const HostPath& target) override;
+
+    // What the connections share with this.
+    struct Line;
 
 private:
     TimeLimits m_limits;
+    FtpType m_type;
+    std::shared_ptr<Line> m_line;
 };
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -13,6 +14,7 @@ struct Deployment {
     // AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
     ClientProfile profile;
 
+    FtpType ftpType = FtpType::Ascii; // for the line alone; dwType stays 1 under both
     Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;

@@ -5,7 +5,7 @@
 namespace lumora {
 
 void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const SendingStop& stop) {
-    for (int round = 1; round <= rounds && !stop.left; ++round) {
+    for (int round = 1; round <= rounds && !stop.left && !stop.StopFlag; ++round) {
         events.pausing(round);
         pump.pump();
     }

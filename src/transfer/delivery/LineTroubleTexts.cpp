@@ -13,6 +13,11 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
         return state.wording(QStringLiteral("למחשב אין קשר לאינטרנט. יש לבדוק את החיבור ולנסות שוב."),
                              QStringLiteral("This computer has no internet connection. Check it and try again."));
     case LineStep::Connect:
+        if (failure.kind == Failure::Kind::Unsupported)
+            return state.wording(
+                QStringLiteral("השרת של המעבדה דורש חיבור מוצפן, ולתוכנה זו אין חיבור כזה. יש להודיע על כך לחנות."),
+                QStringLiteral("The lab's server wants encryption, which this program does not have. Please tell the "
+                               "shop."));
         if (answered)
             return state.wording(QStringLiteral("השרת סירב לכניסה: ייתכן ששם המשתמש או הסיסמה שגויים, או שהשרת עמוס. "
                                                 "אפשר לנסות שוב או להודיע לחנות."),
@@ -46,6 +51,11 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
             QStringLiteral("הקשר נותק בזמן שליחת הקובץ %1. הוא עדיין לא הגיע.").arg(name),
             QStringLiteral("The line was cut while %1 was being sent. It has not arrived yet.").arg(name));
     case LineStep::List:
+        if (failure.kind == Failure::Kind::Damaged)
+            return state.wording(
+                QStringLiteral("לא ניתן לקרוא את רשימת הקבצים של השרת, ולכן לא ידוע מה הגיע. יש להודיע על כך לחנות."),
+                QStringLiteral("The server's list of files can't be read, so it is not known what has arrived. Please "
+                               "tell the shop."));
         return state.wording(QStringLiteral("הקשר נותק בזמן הבדיקה מה הגיע לשרת."),
                              QStringLiteral("The line was cut while the files on the server were being checked."));
     case LineStep::Confirm:

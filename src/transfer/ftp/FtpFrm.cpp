@@ -158,9 +158,9 @@ void FtpFrm::sendOrder() {
 void FtpFrm::stopSending() {
     if (phase() != SendingPhase::Sending && phase() != SendingPhase::Checking)
         return;
-    m_sender.stop.StopFlag = true;
+    m_sender.stopNow();
     Command15.enabled = Command21.enabled = false;
-    const QString stopping = wording(u"נעצר לאחר הקובץ הנוכחי", u"Stopping after the present file");
+    const QString stopping = wording(u"עוצר את המשלוח", u"Stopping the sending");
     Label4Do.text = stopping; // the status line will change with the next event
     status(stopping);
 }
@@ -219,7 +219,7 @@ void FtpFrm::finish(SendingPhase end) {
 }
 
 void FtpFrm::leave() {
-    m_sender.stop.left = true;
+    m_sender.leave();
     stopTimers();
     // During a pass the session may be inside a call; the pass closes it at its next step.
     if (!isUnderWay(phase()))

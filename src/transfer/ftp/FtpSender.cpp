@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "platform/Platform.h"
+#include "transfer/delivery/StoppableLine.h"
 
 namespace lumora {
 
@@ -113,7 +114,18 @@ FtpSender::FtpSender(const ClientProfile& profile, TransferState& transfer, cons
     : session(profile, transfer, platform, events, stop, lists)
     , pass(platform, events, stop, lists, session)
     , check(transfer, platform.pump, events, stop, lists, session)
+    , m_platform(platform)
     , m_events(events) {}
+
+void FtpSender::stopNow() {
+    stop.StopFlag = true;
+    m_platform.internet.abort();
+}
+
+void FtpSender::leave() {
+    stop.left = true;
+    m_platform.internet.abort();
+}
 
 void FtpSender::clearLists() {
     for (TextList* list : {&lists.List3, &lists.List4Makor, &lists.List4Broken, &lists.List6, &lists.List7})
@@ -124,6 +136,7 @@ void FtpSender::clearLists() {
 
 void FtpSender::beginOrder() {
     NumToSend = countList3();
+    session.beginOrder();
     lists.List4Makor.clear();
     lists.List4Makor.append(lists.List3.items());
 }
@@ -139,12 +152,14 @@ void FtpSender::refill() {
 
 std::optional<SendingPhase> FtpSender::RunAttempts() {
     pass.UserStopped = 0;
+    const StoppableLine line(m_platform);
     return FourAttempts(*this, m_events).run(attempts);
 }
 
 std::optional<SendingPhase> FtpSender::runOlderRounds() {
     session.beginPass();
     pass.UserStopped = 0;
+    const StoppableLine line(m_platform);
     return OlderRounds(*this, m_events).run(olderRounds, SendingMoment::RoundBegins);
 }
 

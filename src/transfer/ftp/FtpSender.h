@@ -21,13 +21,18 @@ public:
     // Puts the whole order into List3 again; the pass skips what has arrived.
     void refill();
 
+    // The customer stops, or leaves the page: the call of the line that is under way is cut. A file that was being put
+    // counts as broken.
+    void stopNow();
+    void leave();
+
     // Up to four attempts, each a pass and a check. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> RunAttempts();
     // The older bulk path: up to three rounds over List3, each followed by a check.
     std::optional<SendingPhase> runOlderRounds();
 
     // True when the last check counted as many files as the order has.
-    bool allCounted() const { return check.NumOnServer == NumToSend; }
+    bool allCounted() const { return check.NumOnServer == NumToSend && !check.unreadable; }
     // The end when nothing is left to send but the counts differ.
     SendingPhase silentEnd() const;
 
@@ -42,6 +47,7 @@ private:
     class FourAttempts;
     class OlderRounds;
 
+    const Platform& m_platform;
     SendingEvents& m_events;
 };
 

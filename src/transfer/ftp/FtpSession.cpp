@@ -70,6 +70,12 @@ void FtpSession::log(const QString& text) {
     m_lists.LogList.append(QString::number(now.hour()) + QString::number(now.minute()) + text);
 }
 
+// What a stop has cut is no trouble.
+void FtpSession::trouble(LineStep step, const Failure& failure, const QString& subject) {
+    if (!m_stop.StopFlag && !m_stop.left)
+        m_events.failed(step, failure, subject);
+}
+
 void FtpSession::tellOnce(bool& told, SendingMoment moment, int number) {
     if (!std::exchange(told, true))
         tell(moment, number);
@@ -87,7 +93,7 @@ void FtpSession::FtpOpenInternet() {
         }
         FtpCloseAll();
     }
-    m_events.failed(LineStep::Open, noLine());
+    trouble(LineStep::Open, noLine());
     tellOnce(m_noInternetTold, SendingMoment::NoInternet, i);
     tell(SendingMoment::SessionOpen);
 }
@@ -113,7 +119,7 @@ void FtpSession::FtpConnectServer() {
             bActiveSession = false;
             if (m_stop.StopFlag)
                 return;
-            m_events.failed(LineStep::Connect, last);
+            trouble(LineStep::Connect, last);
             tell(SendingMoment::NotConnected, count);
             return;
         }
@@ -191,10 +197,11 @@ bool FtpSession::enterListedFolder(const QString& name) {
         return false;
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
-        m_events.failed(LineStep::OrderFolder, entered.failure());
+        trouble(LineStep::OrderFolder, entered.failure());
         return false;
     }
-    ListRemoteHere();
+    // Once a put was tried, a refused listing may hide what it left.
+    listHere(m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused);
     if (!bActiveSession)
         return false;
     FillListFromNames(Target::List6, name);
@@ -228,7 +235,7 @@ bool FtpSession::EnterOrderFolder() {
     }
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
-        m_events.failed(LineStep::OrderFolder, entered.failure());
+        trouble(LineStep::OrderFolder, entered.failure());
         return false;
     }
     m_inOrderFolder = true;
@@ -240,7 +247,7 @@ bool FtpSession::EnterOrderFolder() {
 void FtpSession::FtpMakeOrderDir(const QString& name) {
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
-        m_events.failed(LineStep::OrderFolder, made.failure());
+        trouble(LineStep::OrderFolder, made.failure());
         log(QStringLiteral(" make remotedir fail"));
         return;
     }
@@ -260,12 +267,13 @@ bool FtpSession::FtpSendFile(const QString& path) {
     pump();
     const Files& files = m_platform.files;
     const auto local = files.drives().toHost(path);
+    m_putBegun = true;
     const auto sent = local && files.fileExists(path) ? hConnection->put(*local, name)
                                                       : Result<void>(Failure{Failure::Kind::NotFound, path});
     pump();
     if (sent)
         return true;
-    m_events.failed(LineStep::Put, sent.failure(), name);
+    trouble(LineStep::Put, sent.failure(), name);
     log(QStringLiteral("fail to up load") + path);
     m_lists.List7.append(path);
     PauseBar();
@@ -285,23 +293,25 @@ void FtpSession::remove(const QString& remoteName) {
 }
 
 void FtpSession::ClearListing() {
+    m_unreadLine.clear();
     colNames.clear();
     colAttrs.clear();
 }
 
-Result<std::vector<FtpEntry>> FtpSession::find() {
+Result<FtpListing> FtpSession::find(EmptyFolder empty) {
     if (!hConnection)
         return noLine();
-    return hConnection->list(QStringLiteral("*.*"));
+    return hConnection->list(QStringLiteral("*.*"), empty);
 }
 
-void FtpSession::take(const std::vector<FtpEntry>& entries) {
-    for (const FtpEntry& entry : entries) {
+void FtpSession::take(const FtpListing& listing) {
+    m_unreadLine = listing.unread;
+    for (const FtpEntry& entry : listing.entries) {
         colNames.append(entry.name);
         colAttrs.push_back(entry.folder ? folderAttribute : plainAttribute);
     }
     // An empty directory gives one empty name, and the counts of the check rely on it.
-    if (entries.empty()) {
+    if (listing.entries.empty()) {
         colNames.append(QString());
         colAttrs.push_back(0);
     }
@@ -315,12 +325,16 @@ void FtpSession::ListRemote(const QString& dir) {
 }
 
 void FtpSession::ListRemoteHere() {
+    listHere(EmptyFolder::IsListed);
+}
+
+void FtpSession::listHere(EmptyFolder empty) {
     ClearListing();
-    const auto found = find();
+    const auto found = find(empty);
     if (found) {
         take(*found);
     } else {
-        m_events.failed(LineStep::List, found.failure());
+        trouble(LineStep::List, found.failure());
         FtpFatalError(found.failure(), QStringLiteral("FtpFindFirstFile"));
     }
 }
@@ -328,7 +342,7 @@ void FtpSession::ListRemoteHere() {
 void FtpSession::ListRemoteChecked() {
     ClearListing();
     const auto found = find();
-    if (found && !found->empty())
+    if (found && !found->entries.empty())
         take(*found);
 }
 
@@ -345,7 +359,7 @@ bool FtpSession::FtpChangeDir(const QString& dir) {
     const auto changed = hConnection ? hConnection->setCurrentDirectory(target) : Result<void>(noLine());
     RemoteDirectory = target;
     if (!changed) {
-        m_events.failed(LineStep::OrderFolder, changed.failure());
+        trouble(LineStep::OrderFolder, changed.failure());
         FtpFatalError(changed.failure(), QStringLiteral("rcd"));
     }
     return changed.ok();

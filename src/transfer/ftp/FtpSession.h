@@ -24,6 +24,8 @@ public:
     FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events,
                SendingStop& stop, FtpLists& lists);
 
+    // An order begins: nothing of it has been put.
+    void beginOrder() { m_putBegun = false; }
     // Begins a pass: resets its counters, and failures that are told once a pass may be told again.
     void beginPass();
 
@@ -58,6 +60,8 @@ public:
     void ListRemote(const QString& dir);
     void ListRemoteHere();
     void ListRemoteChecked();
+    // The first line of the last listing that could not be read; the listing proves nothing then.
+    const QString& unreadLine() const { return m_unreadLine; }
     enum class Target { List1, List2, List4, List5, List6 };
     void FillListFromNames(Target target, const QString& dir);
 
@@ -95,13 +99,15 @@ public:
 
 private:
     void tell(SendingMoment moment, int number = 0) { m_events.reached(moment, number); }
+    void trouble(LineStep step, const Failure& failure, const QString& subject = {});
     void tellOnce(bool& told, SendingMoment moment, int number = 0);
     void pump();
     void openFolder(const QString& name, int level);
     bool FtpChangeDir(const QString& dir);
     void ClearListing();
-    Result<std::vector<FtpEntry>> find();
-    void take(const std::vector<FtpEntry>& entries);
+    Result<FtpListing> find(EmptyFolder empty = EmptyFolder::IsListed);
+    void listHere(EmptyFolder empty);
+    void take(const FtpListing& listing);
     void FtpFatalError(const Failure& failure, const QString& source);
     void listHereAgain();
 
@@ -112,6 +118,8 @@ private:
     SendingStop& m_stop;
     FtpLists& m_lists;
     bool m_inOrderFolder = false;
+    bool m_putBegun = false; // a put of this order has been tried, so its folder may hold something
+    QString m_unreadLine;
     // Each file of a pass opens a session; these failures are told once a pass.
     bool m_noInternetTold = false;
     bool m_noSessionTold = false;

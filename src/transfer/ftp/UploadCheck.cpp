@@ -69,7 +69,17 @@ void UploadCheck::freshConnection() {
 
 bool UploadCheck::lookUp() {
     const QString& name = m_transfer.ShemTikiya;
-    return m_lists.List5.contains(name) && m_session.enterListedFolder(name);
+    const QStringList before = m_lists.List6.items();
+    if (!m_lists.List5.contains(name) || !m_session.enterListedFolder(name))
+        return false;
+    unreadable = !m_session.unreadLine().isEmpty();
+    if (!unreadable)
+        return true;
+    // Such a listing proves neither what arrived nor what is gone.
+    m_lists.List6.clear();
+    m_lists.List6.append(before);
+    m_events.failed(LineStep::List, {Failure::Kind::Damaged, m_session.unreadLine()});
+    return false;
 }
 
 void UploadCheck::filterDots() {
@@ -94,6 +104,7 @@ void UploadCheck::count() {
 
 void UploadCheck::ListServerFiles() {
     freshCount = false;
+    unreadable = false;
     freshConnection();
     if (m_stop.left)
         return;

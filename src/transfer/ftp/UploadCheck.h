@@ -35,6 +35,7 @@ public:
 
     // Names in List6 without the remains of failed puts.
     std::int16_t NumOnServer = 0;
+    bool unreadable = false; // the last listing of the order's folder had a line that could not be read
     bool freshCount = false; // the last ListServerFiles has read the order's folder; else NumOnServer is older
 
 private:

@@ -11,6 +11,7 @@
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "transfer/delivery/OrderFiles.h"
+#include "transfer/delivery/StoppableLine.h"
 #include "transfer/report/InetForm.h"
 
 namespace lumora {
@@ -53,6 +54,11 @@ void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
 }
 
+void HttpSender::leave() {
+    stop.left = true;
+    m_platform.internet.abort();
+}
+
 void HttpSender::tellMissing() {
     m_events.reached(SendingMoment::Missing, lists.List4Hossarim.count());
 }
@@ -62,6 +68,7 @@ std::optional<SendingPhase> HttpSender::HttpAttempts() {
     // missed more than three there is no such list file, and the whole order is sent again.
     m_listNumber = 1;
     m_listFailure = {};
+    const StoppableLine line(m_platform);
     return run(attempts);
 }
 

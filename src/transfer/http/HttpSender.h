@@ -40,6 +40,8 @@ public:
 
     // Fills List4Kvazim with the files of the order's folder; empty when no folder is set.
     void BuildOrderFileList();
+    // The customer leaves: the call of the line that is under way is cut.
+    void leave();
     // Fills List4Hossarim with the files that the server lacks; with all files when its list can't be trusted.
     void findMissing(int listNumber);
     // Asks the server. listNumber: the list file to download, 0 to 3; none for any other number.

@@ -3,6 +3,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
+#include "transfer/delivery/StoppableLine.h"
 
 #include <algorithm>
 
@@ -36,7 +37,7 @@ bool UploadForm::idle() const {
 }
 
 void UploadForm::leave() {
-    m_sender.stop.left = true;
+    m_sender.leave();
     stopTimers();
 }
 
@@ -78,7 +79,10 @@ void UploadForm::findMissing() {
     }
     m_busy = true;
     enter(SendingPhase::Preparing);
-    m_sender.findMissing(0);
+    {
+        const StoppableLine line(m_platform);
+        m_sender.findMissing(0);
+    }
     m_busy = false;
     if (m_sender.stop.left)
         return;

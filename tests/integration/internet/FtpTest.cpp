@@ -1,15 +1,23 @@
+#include "platform/QtEventPump.h"
 #include "platform/line/PocoInternet.h"
+#include "support/FakeLab.h"
 #include "support/LabServers.h"
+#include "support/OtherFtpServer.h"
 #include "support/TcpRelay.h"
 
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/StreamSocket.h>
+
+#include <QCoreApplication>
 #include <QElapsedTimer>
-#include <QFile>
 #include <QTemporaryDir>
+#include <QTimer>
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <fstream>
+#include <iterator>
+#include <list>
 
 namespace lumora {
 namespace {
@@ -25,8 +33,10 @@ TimeLimits shortLimits() {
 }
 
 QByteArray contentOf(const HostPath& path) {
-    QFile file(toText(path));
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("<absent>");
+    std::ifstream file(path, std::ios::binary);
+    if (!file)
+        return "<absent>";
+    return QByteArray::fromStdString(std::string(std::istreambuf_iterator<char>(file), {}));
 }
 
 // CR, LF, CR LF and LF CR in all mixtures, every byte value, and enough of it that it does not fit a socket's buffer.
@@ -41,6 +51,187 @@ QByteArray anyBytes(int size) {
     return bytes;
 }
 
+HostPath write(const QTemporaryDir& folder, const char* name, const QByteArray& bytes) {
+    const HostPath path = toHostPath(folder.path()) / name;
+    std::ofstream(path, std::ios::binary).write(bytes.constData(), bytes.size());
+    return path;
+}
+
+// --- What every connection must keep, that of the fake lab too ---
+
+struct Lab {
+    const char* name;
+    std::optional<OtherFtpServer::Make> other = {};
+    FtpType type = FtpType::Image;
+    bool keepsNames = true; // in the ANSI code page
+};
+
+void PrintTo(const Lab& lab, std::ostream* out) {
+    *out << lab.name;
+}
+
+class FtpContract : public ::testing::TestWithParam<Lab> {
+protected:
+    void SetUp() override {
+        const Lab& lab = GetParam();
+        if (lab.other) {
+            otherServer.emplace(*lab.other);
+            if (otherServer->absent())
+                GTEST_SKIP() << lab.name << " is not on this machine";
+            ASSERT_TRUE(otherServer->running()) << otherServer->failure().toStdString();
+            std::filesystem::create_directory(otherServer->account() / "zalamim234");
+            std::filesystem::permissions(otherServer->account() / "zalamim234", std::filesystem::perms::all);
+        } else if (lab.name != std::string("fake")) {
+            labServers.emplace();
+            ASSERT_TRUE(labServers->running()) << labServers->failure().toStdString();
+        } else {
+            fake.folders[u"zalamim234"_s];
+        }
+    }
+
+    bool isFake() const { return !otherServer && !labServers; }
+    Result<std::unique_ptr<FtpConnection>> connect(DataChannel channel, const QString& password = {}) {
+        Internet& line = isFake() ? static_cast<Internet&>(fake) : internet;
+        const QString host = otherServer ? otherServer->ftpHost() : labServers ? labServers->ftpHost() : QString();
+        const QString user = otherServer ? OtherFtpServer::user() : LabServers::user();
+        const QString right = otherServer ? OtherFtpServer::password() : LabServers::password();
+        return line.connectFtp(host, user, password.isEmpty() ? right : password, channel);
+    }
+    QByteArray stored(const QString& folder, const char* name) {
+        if (isFake())
+            return fake.folders[folder].contains(QLatin1String(name)) ? fake.folders[folder][QLatin1String(name)]
+                                                                      : QByteArray("<absent>");
+        const HostPath account = otherServer ? otherServer->account() : labServers->account();
+        return contentOf(account / toHostPath(folder) / name);
+    }
+
+    QTemporaryDir local;
+    FakeLab fake;
+    PocoInternet internet{TimeLimits{Poco::Timespan(3, 0), Poco::Timespan(6, 0)}, GetParam().type};
+    std::optional<LabServers> labServers;
+    std::optional<OtherFtpServer> otherServer;
+};
+
+std::map<QString, std::optional<qint64>> filesOf(const FtpListing& listing) {
+    std::map<QString, std::optional<qint64>> files;
+    for (const FtpEntry& entry : listing.entries) {
+        if (entry.name != u"."_s && entry.name != u".."_s)
+            files[entry.name] = entry.length;
+    }
+    return files;
+}
+
+void expectRefused(const Result<void>& answer, const FtpConnection& ftp) {
+    ASSERT_FALSE(answer);
+    EXPECT_EQ(answer.failure().kind, Failure::Kind::Refused) << answer.failure().message.toStdString();
+    EXPECT_TRUE(answer.failure().message.contains(u"550"_s)) << answer.failure().message.toStdString();
+    EXPECT_TRUE(ftp.lastResponse().startsWith(u"550"_s)) << ftp.lastResponse().toStdString();
+}
+
+TEST_P(FtpContract, WalksMakesPutsListsMeasuresGetsAndDeletes) {
+    for (const DataChannel channel : {DataChannel::Passive, DataChannel::Active}) {
+        auto connected = connect(channel);
+        ASSERT_TRUE(connected) << connected.failure().message.toStdString();
+        FtpConnection& ftp = **connected;
+        EXPECT_EQ(ftp.currentDirectory().value(), u"/"_s);
+        ASSERT_TRUE(ftp.setCurrentDirectory(u"zalamim234"_s));
+        EXPECT_EQ(ftp.currentDirectory().value(), u"/zalamim234"_s);
+        const QString order = channel == DataChannel::Passive ? u"2026_11_21_KUP^105"_s : u"2026_11_21_KUP^106"_s;
+        const QString there = u"zalamim234/"_s + order;
+        ASSERT_TRUE(ftp.makeDirectory(order));
+        expectRefused(ftp.makeDirectory(order), ftp);
+        expectRefused(ftp.setCurrentDirectory(u"nowhere"_s), ftp);
+        ASSERT_TRUE(ftp.setCurrentDirectory(order));
+        for (const EmptyFolder empty : {EmptyFolder::IsListed, EmptyFolder::MayBeRefused})
+            EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s, empty)).empty());
+
+        const QByteArray bytes = anyBytes(3'000'000);
+        ASSERT_TRUE(ftp.put(write(local, "x", bytes.left(10'000)), u"a b.jpp"_s));
+        EXPECT_EQ(ftp.length(u"a b.jpp"_s).value(), 10'000);
+        const auto sent = ftp.put(write(local, "x", bytes), u"a b.jpp"_s);
+        ASSERT_TRUE(sent) << sent.failure().message.toStdString();
+        ASSERT_TRUE(ftp.put(write(local, "x", QByteArray()), u"empty"_s));
+        EXPECT_TRUE(stored(there, "a b.jpp") == bytes);
+        EXPECT_EQ(stored(there, "empty"), QByteArray());
+        EXPECT_EQ(ftp.put(toHostPath(local.path()) / "no", u"no"_s).failure().kind, Failure::Kind::NotFound);
+
+        QElapsedTimer listing;
+        listing.start();
+        const auto listed = ftp.list(u"*.*"_s);
+        EXPECT_LT(listing.elapsed(), 3'000) << "the server waits for the end of the data connection";
+        EXPECT_EQ(listed->unread, QString());
+        EXPECT_EQ(filesOf(*listed),
+                  (std::map<QString, std::optional<qint64>>{{u"a b.jpp"_s, bytes.size()}, {u"empty"_s, 0}}));
+        EXPECT_EQ(ftp.length(u"a b.jpp"_s).value(), bytes.size());
+        EXPECT_EQ(ftp.length(u"none"_s).value(), std::nullopt);
+
+        const HostPath back = toHostPath(local.path()) / "back";
+        ASSERT_TRUE(ftp.get(u"a b.jpp"_s, back));
+        // The bytes may come as text does, with line ends of two bytes.
+        EXPECT_TRUE(contentOf(back) == bytes || GetParam().type == FtpType::Ascii);
+        expectRefused(ftp.get(u"none"_s, toHostPath(local.path()) / "never"), ftp);
+        EXPECT_FALSE(fs::exists(toHostPath(local.path()) / "never"));
+        ASSERT_TRUE(ftp.remove(u"a b.jpp"_s));
+        EXPECT_EQ(stored(there, "a b.jpp"), QByteArray("<absent>"));
+        expectRefused(ftp.remove(u"a b.jpp"_s), ftp);
+        ASSERT_TRUE(ftp.setCurrentDirectory(u"/"_s));
+        EXPECT_EQ(ftp.currentDirectory().value(), u"/"_s);
+        ASSERT_TRUE(ftp.setCurrentDirectory(u"/zalamim234"_s));
+        EXPECT_EQ(ftp.currentDirectory().value(), u"/zalamim234"_s);
+        EXPECT_TRUE(!labServers ||
+                    labServers->ftpLog().contains(GetParam().type == FtpType::Ascii ? "TYPE A" : "TYPE I"));
+    }
+}
+
+TEST_P(FtpContract, KeepsNamesOfTheCodePageAndRefusesAWrongPasswordAndANameWithALineBreak) {
+    auto connected = connect(DataChannel::Passive);
+    ASSERT_TRUE(connected);
+    FtpConnection& ftp = **connected;
+    ASSERT_TRUE(ftp.setCurrentDirectory(u"zalamim234"_s));
+    for (const QString& name : {u"x\r\nMKD y"_s, u"x\ny"_s, u"a"_s + QChar(0)}) {
+        EXPECT_FALSE(ftp.makeDirectory(name));
+        EXPECT_FALSE(ftp.put(write(local, "x", "x"), name));
+        EXPECT_FALSE(ftp.list(name));
+    }
+    EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s)).empty());
+    if (GetParam().keepsNames) {
+        ASSERT_TRUE(ftp.makeDirectory(u"הזמנה 7"_s));
+        ASSERT_TRUE(ftp.setCurrentDirectory(u"הזמנה 7"_s));
+        EXPECT_EQ(ftp.currentDirectory().value(), u"/zalamim234/הזמנה 7"_s);
+        ASSERT_TRUE(ftp.put(write(local, "x", "x"), u"שלום.txt"_s));
+        EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s)).contains(u"שלום.txt"_s));
+        EXPECT_TRUE(isFake() || stored(u"zalamim234"_s, "\xe4\xe6\xee\xf0\xe4 7/\xf9\xec\xe5\xed.txt") == "x");
+    }
+    fake.refusedLogins = 1;
+    const auto refused = connect(DataChannel::Passive, u"wr0ng-pass"_s);
+    ASSERT_FALSE(refused);
+    EXPECT_EQ(refused.failure().kind, Failure::Kind::Refused);
+    EXPECT_TRUE(refused.failure().message.contains(u"530"_s)) << refused.failure().message.toStdString();
+    EXPECT_FALSE(refused.failure().message.contains(u"wr0ng"_s));
+}
+
+TEST_P(FtpContract, AnAbortEndsTheConnectionsThatStandAndNoOther) {
+    auto connected = connect(DataChannel::Passive);
+    ASSERT_TRUE(connected);
+    isFake() ? fake.abort() : internet.abort();
+    EXPECT_FALSE((*connected)->list(u"*.*"_s));
+    EXPECT_FALSE((*connected)->put(write(local, "x", "x"), u"x"_s));
+    EXPECT_EQ((*connected)->length(u"x"_s).ok(), false);
+    connected = connect(DataChannel::Passive);
+    ASSERT_TRUE(connected);
+    EXPECT_TRUE((*connected)->list(u"*.*"_s));
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Labs, FtpContract,
+    ::testing::Values(Lab{.name = "fake"}, Lab{.name = "vsftpd_A", .type = FtpType::Ascii}, Lab{.name = "vsftpd_I"},
+                      Lab{.name = "pyftpdlib", .other = OtherFtpServer::Make::PyFtpd, .keepsNames = false},
+                      Lab{.name = "proftpd", .other = OtherFtpServer::Make::ProFtpd},
+                      Lab{.name = "pureftpd", .other = OtherFtpServer::Make::PureFtpd}),
+    [](const ::testing::TestParamInfo<Lab>& each) { return each.param.name; });
+
+// --- A line with faults in front of the lab's server ---
+
 class FtpTest : public ::testing::Test {
 protected:
     QTemporaryDir local;
@@ -49,100 +240,15 @@ protected:
 
     void SetUp() override { ASSERT_TRUE(lab.running()) << lab.failure().toStdString(); }
 
-    HostPath file(const char* name, const QByteArray& bytes) const {
-        const HostPath path = toHostPath(local.path()) / name;
-        std::ofstream(path, std::ios::binary).write(bytes.constData(), bytes.size());
-        return path;
-    }
-    std::unique_ptr<FtpConnection> connect(const QString& host, DataChannel channel = DataChannel::Passive) {
-        auto connection = internet.connectFtp(host, LabServers::user(), LabServers::password(), channel);
+    std::unique_ptr<FtpConnection> connect(const QString& host) {
+        auto connection = internet.connectFtp(host, LabServers::user(), LabServers::password(), DataChannel::Passive);
         EXPECT_TRUE(connection) << (connection ? "" : connection.failure().message.toStdString());
         if (!connection)
             return nullptr;
         EXPECT_TRUE((*connection)->setCurrentDirectory(u"zalamim234"_s));
         return std::move(*connection);
     }
-    static std::vector<std::string> names(const std::vector<FtpEntry>& entries) {
-        std::vector<std::string> all;
-        for (const FtpEntry& entry : entries)
-            all.push_back(entry.name.toStdString());
-        std::sort(all.begin(), all.end());
-        return all;
-    }
 };
-
-TEST_F(FtpTest, WalksMakesPutsListsGetsAndDeletes) {
-    for (const DataChannel channel : {DataChannel::Passive, DataChannel::Active}) {
-        const QByteArray bytes = anyBytes(3'000'000);
-        auto ftp = connect(lab.ftpHost(), channel);
-        ASSERT_TRUE(ftp);
-        EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234"_s);
-        const QString order =
-            channel == DataChannel::Passive ? u"2026_11_21_KUP_1234^105"_s : u"2026_11_21_KUP_1234^106"_s;
-        ASSERT_TRUE(ftp->makeDirectory(order));
-        const auto again = ftp->makeDirectory(order);
-        ASSERT_FALSE(again);
-        EXPECT_EQ(again.failure().kind, Failure::Kind::Refused);
-        EXPECT_TRUE(again.failure().message.contains(u"550"_s)) << again.failure().message.toStdString();
-        ASSERT_TRUE(ftp->setCurrentDirectory(order));
-        EXPECT_TRUE(ftp->list(u"*.*"_s)->empty());
-
-        const auto sent = ftp->put(file("a.jpp", bytes), u"a.jpp"_s);
-        ASSERT_TRUE(sent) << sent.failure().message.toStdString();
-        ASSERT_TRUE(ftp->put(file("empty", QByteArray()), u"empty"_s));
-        const HostPath there = lab.ordersFolder() / toHostPath(order);
-        EXPECT_TRUE(contentOf(there / "a.jpp") == bytes);
-        EXPECT_EQ(contentOf(there / "empty"), QByteArray());
-        EXPECT_EQ(names(*ftp->list(u"*.*"_s)), (std::vector<std::string>{"a.jpp", "empty"}));
-
-        const HostPath back = toHostPath(local.path()) / "back";
-        ASSERT_TRUE(ftp->get(u"a.jpp"_s, back));
-        EXPECT_EQ(contentOf(back).size(), contentOf(there / "a.jpp").size());
-        ASSERT_TRUE(ftp->remove(u"a.jpp"_s));
-        EXPECT_FALSE(fs::exists(there / "a.jpp"));
-        EXPECT_FALSE(ftp->remove(u"a.jpp"_s));
-        EXPECT_TRUE(ftp->lastResponse().startsWith(u"550"_s));
-        EXPECT_FALSE(ftp->get(u"a.jpp"_s, toHostPath(local.path()) / "never"));
-        EXPECT_FALSE(fs::exists(toHostPath(local.path()) / "never"));
-        EXPECT_TRUE(ftp->setCurrentDirectory(u"/"_s));
-        EXPECT_EQ(ftp->currentDirectory().value(), u"/"_s);
-    }
-    EXPECT_FALSE(lab.ftpLog().contains("TYPE I"));
-}
-
-TEST_F(FtpTest, SendsHebrewNamesAsBytesOfTheCodePageAndReadsThemBack) {
-    auto ftp = connect(lab.ftpHost());
-    ASSERT_TRUE(ftp);
-    const QString folder = u"הזמנה 7"_s;
-    ASSERT_TRUE(ftp->makeDirectory(folder));
-    ASSERT_TRUE(ftp->setCurrentDirectory(folder));
-    EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234/"_s + folder);
-    ASSERT_TRUE(ftp->put(file("x", "x"), u"שלום.txt"_s));
-    EXPECT_TRUE(fs::exists(lab.ordersFolder() / "\xe4\xe6\xee\xf0\xe4 7" / "\xf9\xec\xe5\xed.txt"));
-    EXPECT_EQ(names(*ftp->list(u"*.*"_s)), (std::vector<std::string>{"שלום.txt"}));
-}
-
-TEST_F(FtpTest, RefusesANameWithALineBreakBeforeAnythingIsSent) {
-    TcpRelay relay(lab.ftpPort());
-    auto ftp = connect(relay.host());
-    ASSERT_TRUE(ftp);
-    const auto before = relay.commands();
-    for (const QString& name : {u"x\r\nMKD y"_s, u"x\ny"_s, u"a"_s + QChar(0)}) {
-        EXPECT_FALSE(ftp->makeDirectory(name));
-        EXPECT_FALSE(ftp->put(file("x", "x"), name));
-        EXPECT_FALSE(ftp->list(name));
-    }
-    EXPECT_EQ(relay.commands(), before);
-    EXPECT_TRUE(ftp->currentDirectory());
-}
-
-TEST_F(FtpTest, TellsARefusedLoginInTheServersWordsAndNeverThePassword) {
-    const auto refused = internet.connectFtp(lab.ftpHost(), LabServers::user(), u"wr0ng-pass"_s, DataChannel::Passive);
-    ASSERT_FALSE(refused);
-    EXPECT_EQ(refused.failure().kind, Failure::Kind::Refused);
-    EXPECT_TRUE(refused.failure().message.contains(u"530"_s)) << refused.failure().message.toStdString();
-    EXPECT_FALSE(refused.failure().message.contains(u"wr0ng"_s));
-}
 
 TEST_F(FtpTest, FailsAtOnceWhereNobodyListensAndWithinTheLimitWhereNobodyAnswers) {
     const auto closed = internet.connectFtp(u"127.0.0.1:%1"_s.arg(FreePort()), LabServers::user(),
@@ -162,7 +268,7 @@ TEST_F(FtpTest, FallsBackToPasvWhereEpsvIsRefused) {
     relay.setFaults({.command = "EPSV", .reply = "500 Unknown command"});
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
-    ASSERT_TRUE(ftp->put(file("x", "x"), u"x.jpp"_s));
+    ASSERT_TRUE(ftp->put(write(local, "x", "x"), u"x.jpp"_s));
     EXPECT_TRUE(ftp->list(u"*.*"_s));
     EXPECT_EQ(relay.commands().count("EPSV"), 1);
     EXPECT_EQ(relay.commands().count("PASV"), 2);
@@ -180,6 +286,12 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         {"cut in the middle", {.cutDataAfter = 300'000, .times = 1}, Failure::Kind::Refused, 3'000'000},
         {"cut behind what fits the buffers", {.cutDataAfter = 100, .times = 1}, Failure::Kind::Refused, 5'000},
         {"stalled", {.stallDataAfter = 300'000, .times = 1}, Failure::Kind::TimedOut, 9'000'000},
+        {"closing reply bad", {.closingReply = "451 Disk full", .times = 1}, Failure::Kind::Refused, 5'000},
+        {"closing reply never comes", {.holdClosingReply = true, .times = 1}, Failure::Kind::TimedOut, 5'000},
+        {"cut with a good reply",
+         {.cutDataAfter = 300'000, .serverSeesEnd = true, .times = 1},
+         Failure::Kind::Disconnected,
+         3'000'000},
         {"closing reply lost", {.loseClosingReply = true, .times = 1}, Failure::Kind::Disconnected, 5'000},
         {"put refused", {.command = "STOR", .reply = "552 Quota exceeded", .times = 1}, Failure::Kind::Refused, 5'000},
         {"too many", {.command = "STOR", .reply = "421 Too many", .times = 1}, Failure::Kind::Refused, 5'000},
@@ -195,7 +307,7 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         QElapsedTimer waiting;
         waiting.start();
         const QString name = QString::fromLatin1(each.name) + u".jpp"_s;
-        const auto sent = ftp->put(file("x", bytes), name);
+        const auto sent = ftp->put(write(local, "x", bytes), name);
         EXPECT_FALSE(sent);
         EXPECT_EQ(relay.faultsMade(), 1);
         if (sent)
@@ -206,7 +318,7 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         ftp = connect(relay.host());
         ASSERT_TRUE(ftp);
         const QString second = u"2"_s + name;
-        ASSERT_TRUE(ftp->put(file("x", bytes), second));
+        ASSERT_TRUE(ftp->put(write(local, "x", bytes), second));
         EXPECT_TRUE(contentOf(lab.ordersFolder() / toHostPath(second)) == bytes);
     }
 }
@@ -216,47 +328,108 @@ TEST_F(FtpTest, TakesAReplyThatComesLateAndAConnectionThatIsRefusedOnce) {
     relay.setFaults({.delayReplies = std::chrono::milliseconds(100)});
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
-    EXPECT_TRUE(ftp->put(file("x", "x"), u"late.jpp"_s));
+    EXPECT_TRUE(ftp->put(write(local, "x", "x"), u"late.jpp"_s));
     relay.setFaults({.refuseConnections = true, .times = 1});
     EXPECT_FALSE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
     EXPECT_TRUE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
 }
 
-TEST_F(FtpTest, MissesALocalFileBeforeItAsksTheServer) {
-    auto ftp = connect(lab.ftpHost());
+TEST_F(FtpTest, ReadsRepliesOfManyLines) {
+    TcpRelay relay(lab.ftpPort());
+    relay.setFaults({.manyLines = true});
+    auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
-    const auto missing = ftp->put(toHostPath(local.path()) / "no.jpp", u"no.jpp"_s);
-    ASSERT_FALSE(missing);
-    EXPECT_EQ(missing.failure().kind, Failure::Kind::NotFound);
-    EXPECT_TRUE(ftp->list(u"*.*"_s)->empty());
+    ASSERT_TRUE(ftp->put(write(local, "x", "xx"), u"x.jpp"_s));
+    EXPECT_EQ(ftp->list(u"*.*"_s)->entries.size(), 1U);
+    EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234"_s);
+    EXPECT_FALSE(ftp->remove(u"none"_s));
+    EXPECT_EQ(ftp->lastResponse().count(u'\n'), 2);
 }
 
-TEST(SecondKindOfFtpServer, TakesTheSameCalls) {
-    SecondFtpServer server;
-    ASSERT_TRUE(server.running()) << server.failure().toStdString();
-    QTemporaryDir local;
-    PocoInternet internet(shortLimits());
-    auto opened = internet.connectFtp(server.ftpHost(), SecondFtpServer::user(), SecondFtpServer::password(),
-                                      DataChannel::Passive);
-    ASSERT_TRUE(opened) << opened.failure().message.toStdString();
-    FtpConnection& ftp = **opened;
-    EXPECT_EQ(ftp.currentDirectory().value(), u"/"_s);
-    ASSERT_TRUE(ftp.makeDirectory(u"zalamim234"_s));
-    ASSERT_TRUE(ftp.setCurrentDirectory(u"zalamim234"_s));
-    EXPECT_TRUE(ftp.list(u"*.*"_s)->empty());
-    // This kind turns CR LF into LF on arrival, so only bytes without a line end of two are compared.
-    QByteArray bytes = anyBytes(2'000'000);
-    bytes.replace('\r', 'r');
-    const HostPath source = toHostPath(local.path()) / "a";
-    std::ofstream(source, std::ios::binary).write(bytes.constData(), bytes.size());
-    const auto sent = ftp.put(source, u"no  ending"_s);
-    ASSERT_TRUE(sent) << sent.failure().message.toStdString();
-    EXPECT_TRUE(contentOf(server.account() / "zalamim234" / "no  ending") == bytes);
-    const auto entries = ftp.list(u"*.*"_s);
-    ASSERT_EQ(entries->size(), 1U);
-    EXPECT_EQ(entries->front().name, u"no  ending"_s);
-    EXPECT_FALSE(ftp.remove(u"missing"_s));
-    EXPECT_TRUE(ftp.remove(u"no  ending"_s));
+TEST_F(FtpTest, TellsARefusedListingFromAnEmptyFolderAndEncryptionFromAWrongPassword) {
+    TcpRelay relay(lab.ftpPort());
+    auto ftp = connect(relay.host());
+    ASSERT_TRUE(ftp);
+    for (const char* reply : {"550 No files found", "450 No files found", "426 Cut"}) {
+        relay.setFaults({.command = "LIST", .reply = reply});
+        EXPECT_FALSE(ftp->list(u"*.*"_s)) << reply;
+        EXPECT_EQ(ftp->list(u"*.*"_s, EmptyFolder::MayBeRefused).ok(), reply[1] == '5') << reply;
+    }
+    relay.setFaults({.command = "EPSV", .reply = "550 No port", .times = 1});
+    EXPECT_TRUE(ftp->list(u"*.*"_s, EmptyFolder::MayBeRefused));
+    for (const char* reply : {"530 Non-anonymous sessions must use encryption.", "550 SSL/TLS required",
+                              "534 Policy requires SSL", "421 Sorry, cleartext sessions are not accepted"}) {
+        relay.setFaults({.command = "USER", .reply = reply, .times = 1});
+        const auto refused = internet.connectFtp(relay.host(), u"ftp"_s, u"x"_s, DataChannel::Passive);
+        ASSERT_FALSE(refused);
+        EXPECT_EQ(refused.failure().kind, Failure::Kind::Unsupported) << reply;
+        EXPECT_TRUE(refused.failure().message.startsWith(u"this server wants encryption"_s));
+    }
+}
+
+// Each ends within a second, by a click on the thread that waits.
+TEST_F(FtpTest, AnAbortEndsEveryWait) {
+    PocoInternet patient;
+    QtEventPump pump;
+    patient.pumpWhileWaiting(&pump);
+    TcpRelay relay(lab.ftpPort());
+    const auto connected = [&] {
+        relay.setFaults({});
+        auto ftp = patient.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive);
+        EXPECT_TRUE((*ftp)->setCurrentDirectory(u"zalamim234"_s));
+        return std::move(*ftp);
+    };
+    const HostPath large = write(local, "x", anyBytes(9'000'000));
+    // Its queue is full, so that a further connection is never made.
+    Poco::Net::ServerSocket full;
+    full.bind(Poco::Net::SocketAddress("127.0.0.1", 0));
+    full.listen(0);
+    std::list<Poco::Net::StreamSocket> queue(3);
+    for (Poco::Net::StreamSocket& socket : queue)
+        socket.connectNB(full.address());
+    const std::pair<const char*, std::function<bool()>> waits[] = {
+        {"connect",
+         [&] {
+             const QString host = u"127.0.0.1:%1"_s.arg(full.address().port());
+             return patient.connectFtp(host, u"a"_s, u"b"_s, DataChannel::Passive).ok();
+         }},
+        {"list",
+         [&] {
+             auto ftp = connected();
+             relay.setFaults({.stallDataAfter = 0, .times = 1});
+             return ftp->list(u"*.*"_s).ok();
+         }},
+        {"put",
+         [&] {
+             auto ftp = connected();
+             relay.setFaults({.stallDataAfter = 300'000, .times = 1});
+             return ftp->put(large, u"stalled.jpp"_s).ok();
+         }},
+        {"closing reply",
+         [&] {
+             auto ftp = connected();
+             relay.setFaults({.holdClosingReply = true, .times = 1});
+             return ftp->put(write(local, "y", "y"), u"held.jpp"_s).ok();
+         }},
+        {"name server",
+         [&] { return patient.connectFtp(u"ftp.invalid"_s, u"a"_s, u"b"_s, DataChannel::Passive).ok(); }},
+    };
+    for (const auto& [name, wait] : waits) {
+        QElapsedTimer waiting;
+        QTimer aborting;
+        aborting.callOnTimeout([&] {
+            aborting.stop();
+            waiting.start();
+            patient.abort();
+        });
+        aborting.start(400);
+        EXPECT_FALSE(wait()) << name;
+        if (waiting.isValid()) {
+            EXPECT_LT(waiting.elapsed(), 1000) << name;
+        } else {
+            EXPECT_EQ(std::string(name), "name server") << "failed before the abort";
+        }
+    }
 }
 
 } // namespace

@@ -1,3 +1,4 @@
+#include "platform/QtEventPump.h"
 #include "platform/line/PocoInternet.h"
 #include "support/LabServers.h"
 #include "support/TcpRelay.h"
@@ -7,19 +8,78 @@
 #include <Poco/Net/SocketAddress.h>
 #include <Poco/Net/StreamSocket.h>
 
+#include <QCoreApplication>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTimer>
 
 #include <gtest/gtest.h>
 
-#include <fstream>
+#include <array>
+#include <atomic>
+#include <mutex>
 #include <thread>
 
 namespace lumora {
 namespace {
 
 using namespace Qt::StringLiterals;
+
+// Answers each connection with the next of its texts and ends it.
+class ScriptedWeb {
+public:
+    explicit ScriptedWeb(QByteArrayList answers)
+        : m_answers(std::move(answers))
+        , m_thread([this] { serve(); }) {}
+    ~ScriptedWeb() {
+        m_stop = true;
+        m_thread.join();
+    }
+    QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_server.address().port()); }
+    // The requests so far, whole.
+    QByteArrayList requests() const {
+        const std::lock_guard lock(m_mutex);
+        return m_requests;
+    }
+
+private:
+    void serve() {
+        while (!m_stop) {
+            if (!m_server.poll(Poco::Timespan(0, 20'000), Poco::Net::Socket::SELECT_READ))
+                continue;
+            Poco::Net::StreamSocket line = m_server.acceptConnection();
+            QByteArray request;
+            std::array<char, 4096> part;
+            while (!whole(request)) {
+                const int count = line.receiveBytes(part.data(), static_cast<int>(part.size()));
+                if (count <= 0)
+                    break;
+                request.append(part.data(), count);
+            }
+            const std::lock_guard lock(m_mutex);
+            const QByteArray answer = m_answers.value(m_requests.size(), m_answers.last());
+            m_requests += request;
+            line.sendBytes(answer.constData(), static_cast<int>(answer.size()));
+        }
+    }
+    static bool whole(const QByteArray& request) {
+        const qsizetype end = request.indexOf("\r\n\r\n");
+        return end >= 0 && (!request.startsWith("POST") || request.endsWith("body"));
+    }
+
+    Poco::Net::ServerSocket m_server{Poco::Net::SocketAddress("127.0.0.1", 0)};
+    mutable std::mutex m_mutex;
+    QByteArrayList m_answers;
+    QByteArrayList m_requests;
+    std::atomic<bool> m_stop = false;
+    std::thread m_thread;
+};
+
+QByteArray redirect(int status, const QByteArray& location) {
+    return "HTTP/1.1 " + QByteArray::number(status) + " Moved\r\nLocation: " + location +
+           "\r\nContent-Length: 5\r\n\r\nmoved";
+}
 
 class HttpTest : public ::testing::Test {
 protected:
@@ -81,6 +141,85 @@ TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatWasCutOrStoodStill) {
     ASSERT_FALSE(stalled);
     EXPECT_EQ(stalled.failure().kind, Failure::Kind::TimedOut) << stalled.failure().message.toStdString();
     EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
+}
+
+TEST_F(HttpTest, FollowsRedirectsToTheSameHostAndTakesNoAnswerThatIsShort) {
+    const QByteArray there = "HTTP/1.1 200 OK\r\nContent-Length: 5\r\n\r\nthere";
+    const struct {
+        const char* name;
+        bool post;
+        QByteArrayList answers; // the last one again and again
+        const char* body;       // null: a failure
+        int requests;
+        const char* last; // how the last request begins
+    } cases[] = {
+        {"301", false, {redirect(301, "/new?a=1"), there}, "there", 2, "GET /new?a=1 HTTP/1.1\r\n"},
+        {"302, beside it", false, {redirect(302, "new"), there}, "there", 2, "GET /a/new HTTP/1.1\r\n"},
+        {"307", false, {redirect(307, "/new"), there}, "there", 2, "GET /new "},
+        {"five", false, QByteArrayList(5, redirect(301, "/new")) << there, "there", 6, "GET /new "},
+        {"without end", false, {redirect(301, "/new")}, nullptr, 6, "GET /new "},
+        {"another host", false, {redirect(302, "http://192.0.2.1/new")}, "moved", 1, "GET /a/b "},
+        {"another scheme", false, {redirect(302, "https://127.0.0.1/new")}, "moved", 1, "GET /a/b "},
+        {"POST 301", true, {redirect(301, "/new"), there}, nullptr, 1, "POST /a/b "},
+        {"POST 302", true, {redirect(302, "/new"), there}, nullptr, 1, "POST /a/b "},
+        {"POST 307", true, {redirect(307, "/new"), there}, "there", 2, "POST /new "},
+        {"POST 308", true, {redirect(308, "/new"), there}, "there", 2, "POST /new "},
+        {"POST 308 elsewhere", true, {redirect(308, "http://192.0.2.1/new")}, nullptr, 1, "POST /a/b "},
+        {"short", false, {"HTTP/1.1 200 OK\r\nContent-Length: 100\r\n\r\nhalf"}, nullptr, 1, "GET /a/b "},
+        {"POST short", true, {"HTTP/1.1 200 OK\r\nContent-Length: 100\r\n\r\nhalf"}, nullptr, 1, "POST /a/b "},
+    };
+    for (const auto& each : cases) {
+        SCOPED_TRACE(each.name);
+        ScriptedWeb web(each.answers);
+        PostRequest request;
+        request.body = "the body";
+        const QString url = web.site() + u"/a/b?c"_s;
+        const auto answer = each.post ? internet.post(url, request) : internet.fetch(url);
+        EXPECT_EQ(answer.ok(), each.body != nullptr);
+        EXPECT_TRUE(!answer || *answer == each.body);
+        ASSERT_EQ(web.requests().size(), each.requests);
+        QByteArray last = web.requests().last();
+        EXPECT_TRUE(last.replace("?c ", " ").startsWith(each.last)) << last.toStdString();
+        EXPECT_TRUE(!each.post || last.endsWith("the body"));
+    }
+}
+
+TEST_F(HttpTest, TellsALengthByHead) {
+    const struct {
+        QByteArray answer;
+        std::optional<qint64> length;
+    } cases[] = {{"HTTP/1.1 200 OK\r\nContent-Length: 9424170000\r\n\r\n", 9424170000},
+                 {"HTTP/1.1 200 OK\r\n\r\n", std::nullopt},
+                 {"HTTP/1.1 404 Not Found\r\nContent-Length: 9\r\n\r\n", std::nullopt}};
+    for (const auto& each : cases) {
+        ScriptedWeb web({each.answer});
+        const auto length = internet.contentLength(web.site() + u"/x"_s);
+        ASSERT_TRUE(length) << length.failure().message.toStdString();
+        EXPECT_EQ(*length, each.length);
+        EXPECT_TRUE(web.requests().first().startsWith("HEAD /x HTTP/1.1\r\n"));
+    }
+}
+
+TEST_F(HttpTest, AnAbortEndsACallWithinASecond) {
+    PocoInternet patient;
+    QtEventPump pump;
+    patient.pumpWhileWaiting(&pump);
+    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
+    const QString url = u"http://%1/x"_s.arg(relay.host());
+    for (const bool post : {false, true}) {
+        relay.setFaults({.stallDataAfter = 10, .times = 1});
+        QElapsedTimer waiting;
+        QTimer aborting;
+        aborting.callOnTimeout([&] {
+            aborting.stop();
+            waiting.start();
+            patient.abort();
+        });
+        aborting.start(300);
+        EXPECT_FALSE(post ? patient.post(url, {}) : patient.fetch(url));
+        ASSERT_TRUE(waiting.isValid()) << "it ended before the abort";
+        EXPECT_LT(waiting.elapsed(), 1000);
+    }
 }
 
 TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatNeverEnds) {

@@ -1,0 +1,98 @@
+#include "platform/line/LineSocket.h"
+
+#include <Poco/Exception.h>
+#include <Poco/Net/IPAddress.h>
+#include <Poco/Net/NetException.h>
+
+#include <chrono>
+#include <condition_variable>
+#include <memory>
+#include <mutex>
+#include <optional>
+#include <thread>
+
+namespace lumora {
+namespace {
+
+using Poco::Net::SocketAddress;
+
+// A name server is asked by a thread that outlives the call when the answer does not come.
+struct NameAnswer {
+    std::mutex mutex;
+    std::condition_variable told;
+    std::optional<SocketAddress> address;
+    std::string failure;
+    bool done = false;
+};
+
+constexpr auto lookAtAbort = std::chrono::milliseconds(50);
+
+} // namespace
+
+void LineCall::check() const {
+    if (aborted())
+        throw Poco::Net::ConnectionAbortedException("the sending was stopped");
+}
+
+SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, const LineCall& call) {
+    const std::size_t bracket = host.rfind(']');
+    const std::size_t colon = host.find(':', bracket == std::string::npos ? 0 : bracket);
+    std::string name = host.substr(0, colon);
+    if (!name.empty() && name.front() == '[' && name.back() == ']')
+        name = name.substr(1, name.size() - 2);
+    const std::string port = colon == std::string::npos ? std::to_string(usualPort) : host.substr(colon + 1);
+    Poco::Net::IPAddress numeric;
+    if (Poco::Net::IPAddress::tryParse(name, numeric))
+        return SocketAddress(name, port);
+
+    const auto answer = std::make_shared<NameAnswer>();
+    std::thread([answer, name, port] {
+        std::optional<SocketAddress> address;
+        std::string failure;
+        try {
+            address = SocketAddress(name, port);
+        } catch (const Poco::Exception& exception) {
+            failure = exception.displayText();
+        } catch (const std::exception& exception) {
+            failure = exception.what();
+        }
+        const std::lock_guard lock(answer->mutex);
+        answer->address = address;
+        answer->failure = failure;
+        answer->done = true;
+        answer->told.notify_one();
+    }).detach();
+    std::unique_lock lock(answer->mutex);
+    const auto limit =
+        std::chrono::steady_clock::now() + std::chrono::microseconds(call.limits().connect.totalMicroseconds());
+    while (!answer->told.wait_for(lock, lookAtAbort, [&] { return answer->done; })) {
+        call.check();
+        if (std::chrono::steady_clock::now() > limit)
+            throw Poco::TimeoutException();
+    }
+    if (!answer->address)
+        throw Poco::Net::HostNotFoundException(answer->failure);
+    return *answer->address;
+}
+
+LineSocket::LineSocket(const SocketAddress& address, const LineCall& call)
+    : socket(address.family())
+    , watch(call.line(), socket) {
+    call.check();
+    try {
+        socket.connect(address, call.limits().connect);
+    } catch (const Poco::Exception&) {
+        call.check();
+        throw;
+    }
+    call.check();
+    socket.setReceiveTimeout(call.limits().silence);
+    socket.setSendTimeout(call.limits().silence);
+}
+
+void LineSocket::close() {
+    watch.release();
+    socket.close();
+}
+
+} // namespace lumora
