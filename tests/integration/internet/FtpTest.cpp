@@ -323,17 +323,6 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
     }
 }
 
-TEST_F(FtpTest, TakesAReplyThatComesLateAndAConnectionThatIsRefusedOnce) {
-    TcpRelay relay(lab.ftpPort());
-    relay.setFaults({.delayReplies = std::chrono::milliseconds(100)});
-    auto ftp = connect(relay.host());
-    ASSERT_TRUE(ftp);
-    EXPECT_TRUE(ftp->put(write(local, "x", "x"), u"late.jpp"_s));
-    relay.setFaults({.refuseConnections = true, .times = 1});
-    EXPECT_FALSE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
-    EXPECT_TRUE(internet.connectFtp(relay.host(), LabServers::user(), LabServers::password(), DataChannel::Passive));
-}
-
 TEST_F(FtpTest, ReadsRepliesOfManyLines) {
     TcpRelay relay(lab.ftpPort());
     relay.setFaults({.manyLines = true});
