@@ -323,9 +323,9 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
     }
 }
 
-TEST_F(FtpTest, ReadsRepliesOfManyLines) {
+TEST_F(FtpTest, ReadsRepliesOfManyLinesThatComeLate) {
     TcpRelay relay(lab.ftpPort());
-    relay.setFaults({.manyLines = true});
+    relay.setFaults({.delayReplies = std::chrono::milliseconds(30), .manyLines = true});
     auto ftp = connect(relay.host());
     ASSERT_TRUE(ftp);
     ASSERT_TRUE(ftp->put(write(local, "x", "xx"), u"x.jpp"_s));
