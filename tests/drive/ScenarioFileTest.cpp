@@ -53,6 +53,9 @@ TEST(ScenarioFile, TakesTheArgumentsOfEachCommand) {
     const ScenarioCommand until = only("until FtpFrm.Label4 20.0 all is there # really");
     EXPECT_EQ(until.seconds, 20);
     EXPECT_EQ(until.text, u"all is there # really");
+    const ScenarioCommand shown = only("until-visible FtpFrm.Command28 20 no # hidden");
+    EXPECT_EQ(shown.seconds, 20);
+    EXPECT_FALSE(shown.yes);
 }
 
 TEST(ScenarioFile, TakesTextsAsTheyStandToTheEndOfTheLine) {

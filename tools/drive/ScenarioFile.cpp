@@ -38,8 +38,8 @@ struct Grammar {
 
 constexpr double patienceOfPage = 30; // seconds, if the line names none
 
-const std::array<Grammar, 19>& grammars() {
-    static const std::array<Grammar, 19> all{{
+const std::array<Grammar, 20>& grammars() {
+    static const std::array<Grammar, 20> all{{
         {ScenarioVerb::Page,
          "page",
          {Takes::Page, Takes::OptionalSeconds},
@@ -80,6 +80,10 @@ const std::array<Grammar, 19>& grammars() {
          "until",
          {Takes::Control, Takes::Seconds, Takes::Text},
          "PAGE.CONTROL SECONDS TEXT: wait for a text"},
+        {ScenarioVerb::UntilVisible,
+         "until-visible",
+         {Takes::Control, Takes::Seconds, Takes::YesNo},
+         "PAGE.CONTROL SECONDS yes|no: wait until it is shown or hidden"},
         {ScenarioVerb::Dump,
          "dump",
          {Takes::Control, Takes::SomeText},

@@ -27,6 +27,7 @@ enum class ScenarioVerb {
     ExpectItem,
     ExpectMessage,
     Until,
+    UntilVisible,
     Dump,
     Shot,
     Pause,
@@ -39,9 +40,9 @@ struct ScenarioCommand {
     QString page;
     QString control;       // "Command12", "Image1(0)"
     QString text;          // unescaped; also the path of pick and dump, and the name of a shot
-    double seconds = 0;    // page, until, pause, hold
+    double seconds = 0;    // page, until, until-visible, pause, hold
     int number = 0;        // expect-count, expect-item
-    bool yes = false;      // tick, answer, expect-visible
+    bool yes = false;      // tick, answer, expect-visible, until-visible
     QPointF from, to;      // press-at (only from), drag: per cent of the control's width and height
     bool rightKey = false; // press-at: right mouse button
 };

@@ -93,7 +93,7 @@ void ScenarioPlayer::step() {
     const Look seen = look(command);
     if (seen.held) {
         if (command.verb == ScenarioVerb::Page || command.verb == ScenarioVerb::Until ||
-            command.verb == ScenarioVerb::Pause)
+            command.verb == ScenarioVerb::UntilVisible || command.verb == ScenarioVerb::Pause)
             m_goesOnInTheMiddle = busy;
         moveOn();
     } else if (m_atThisLine.elapsed() >= seen.patience * 1000) {
@@ -107,6 +107,7 @@ bool ScenarioPlayer::mayRunNow(ScenarioVerb verb) const {
     switch (verb) {
     case ScenarioVerb::Page:
     case ScenarioVerb::Until:
+    case ScenarioVerb::UntilVisible:
     case ScenarioVerb::Pause:
     case ScenarioVerb::Shot:
     case ScenarioVerb::Dump:
@@ -176,11 +177,12 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
         const Result<QString> text = m_controls.text(command.page, command.control);
         return {text && *text == command.text, name + u' ' + quoted(command.text), inWords(text), command.seconds};
     }
-    case ScenarioVerb::ExpectVisible: {
+    case ScenarioVerb::ExpectVisible:
+    case ScenarioVerb::UntilVisible: {
         const Result<bool> visible = m_controls.visible(command.page, command.control);
         return {visible && *visible == command.yes,
                 name + (command.yes ? QStringLiteral(" visible: yes") : QStringLiteral(" visible: no")),
-                inWords(visible)};
+                inWords(visible), command.seconds};
     }
     case ScenarioVerb::ExpectCount: {
         const Result<int> count = m_controls.count(command.page, command.control);

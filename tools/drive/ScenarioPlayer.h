@@ -16,8 +16,9 @@ class Program;
 
 // Plays scenario files on the pages as a customer would, from the event loop, so that it can also watch and stop work
 // that is under way. Before it touches a control it closes all open message boxes.
-// A line waits until the work started by the lines before it has ended. Only page, until, pause, shot, dump, pick and
-// answer run during such work; after a page, until or pause that was fulfilled during it the next line runs at once.
+// A line waits until the work started by the lines before it has ended. Only page, until, until-visible, pause, shot,
+// dump, pick and answer run during such work; after a page, until, until-visible or pause that was fulfilled during it
+// the next line runs at once.
 class ScenarioPlayer : public QObject {
     Q_OBJECT
 public:

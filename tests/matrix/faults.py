@@ -1,0 +1,357 @@
+"""The faults, a row each: name, what happens at which command, and what else the runner must know of it.
+
+FTP: command -> (what is done, how often, from which coming on), see relay.py. HTTP: route -> the same, see servers.py."""
+import re
+import time
+
+from relay import ALWAYS, drop
+
+STRAY = 'Thumbs.db'
+
+
+class Fault:
+    def __init__(self, name, acts=None, **more):
+        self.name = name
+        self.acts = {word: act if isinstance(act, tuple) else (act,) for word, act in (acts or {}).items()}
+        self.host = more.pop('host', 'relay')   # or closed, blackhole, ipv6: what stands in the lab's file
+        self.clock = more.pop('clock', 10)      # how many times as fast the program's clock runs
+        self.limit = more.pop('limit', 150)      # seconds here until the program hangs
+        self.only = more.pop('only', ())        # the servers that it is played before; none: all
+        self.again = more.pop('again', False)   # what the program is told makes it send again what is there
+        self.literal = more.pop('literal', '')  # why a lie stays even with Careful
+        self.quick = more.pop('quick', False)   # also in ./test
+        self.as_installed = more.pop('as_installed', False)  # the server changes files under TYPE A, and the lab has not set I
+        self.heals = more.pop('heals', True)    # the server is good when the order is sent again
+        assert not more, more
+
+
+# --- what can be done at a command
+
+def reply(text):
+    return lambda session, line: session.tell(text) or True
+
+
+def bye(text):
+    def act(session, line):
+        session.tell(text)
+        session.close()
+        raise OSError
+    return act
+
+
+def cut(session, line):
+    session.cut()
+
+
+def hang(session, line):
+    session.wait_for_the_end()
+
+
+def late(seconds):
+    return lambda session, line: time.sleep(seconds)
+
+
+def passed(**options):
+    return lambda session, line: session.forward(line, **options)
+
+
+def closing(text):
+    return passed(answer=lambda given: text)
+
+
+def hang_before_the_end(session, line):
+    return session.forward(line, answer=lambda given: session.wait_for_the_end())
+
+
+def half(content):
+    return content[:len(content) // 2]
+
+
+def then_gone(text=None):
+    """Stored, taken away again, and answered so."""
+    def act(session, line):
+        def answer(given):
+            session.server.tell('DELE' + line[4:])
+            session.server.reply()
+            return text or given
+        return session.forward(line, answer=answer)
+    return act
+
+
+def stored_as(rename):
+    return lambda session, line: session.forward(line[:5] + rename(line[5:]))
+
+
+def refuse_second(session, line):
+    if len(session.relay.open) > 1:
+        session.tell('421 one connection for each address')
+        session.close()
+        return True
+    return False
+
+
+def forward_and_close(session, line):
+    session.forward(line)
+    session.close()
+    raise OSError
+
+
+def empty_is(text):
+    def act(session, line):
+        seen = []
+        return session.forward(line, change=lambda content: seen.append(content) or content,
+                               answer=lambda given: text if not seen[0].strip() else given)
+    return act
+
+
+def at_each(act, words='GREETING USER PASS PWD TYPE EPSV CWD MKD DELE SIZE STOR LIST'):
+    return {word: act for word in words.split()}
+
+
+def many_lines(text):
+    return f'{text[:3]}-one\n 999 two\n{text[:3]}-three\n{text}' if text else text
+
+
+def without_parentheses(text):
+    return re.sub(r'\(([\d,]+)\)', r'\1', text)
+
+
+def no_epsv(pasv=None, text='500 unknown'):
+    return {'EPSV': reply(text), **({'PASV': pasv} if pasv else {})}
+
+
+def foreign_order(session, line):
+    session.relay.lab.put_foreign_order()
+
+
+def put_stray(session, line):
+    session.relay.lab.put_stray()
+
+
+LINE = re.compile(rb'^([d-])\S*\s+\S+\s+\S+\s+\S+\s+(\d+) (\w+) +(\d+) +(\S+) (.*?)\r?$', re.M)
+
+
+def lines_as(form):
+    """A listing whose lines are written anew: form(kind, size, month, day, time, name)."""
+    def change(content):
+        return b''.join(form(*match.groups()) + b'\r\n' for match in LINE.finditer(content) if match[6] not in (b'.', b'..'))
+    return passed(change=change)
+
+
+LISTINGS = {
+    'ISO dates': lambda k, s, m, d, t, n: k + b'rw-r--r-- 1 lab lab ' + s + b' 2026-11-22 01:02 ' + n,
+    'months of another language': lambda k, s, m, d, t, n: k + b'rw-r--r-- 1 lab lab ' + s + b' nov. 22 01:02 ' + n,
+    'bare names': lambda k, s, m, d, t, n: n,
+    'DOS': lambda k, s, m, d, t, n: b'11-22-26  01:02AM ' + (b'      <DIR>          ' if k == b'd' else s.rjust(20) + b' ') + n,
+    'an ACL sign and a year': lambda k, s, m, d, t, n: k + b'rw-r--r--+ 1 lab lab ' + s + b' Nov 22  2026 ' + n,
+    'no group': lambda k, s, m, d, t, n: k + b'rw-r--r-- 1 lab ' + s + b' Nov 22 01:02 ' + n,
+    'NetWare': lambda k, s, m, d, t, n: k + b' [R----F--] lab ' + s.rjust(12) + b' Nov 22 01:02 ' + n,
+    'EPLF': lambda k, s, m, d, t, n: b'+' + (b'/' if k == b'd' else b'r,s' + s) + b',\t' + n,
+    'facts as of MLSD': lambda k, s, m, d, t, n: b'type=' + (b'dir' if k == b'd' else b'file;size=' + s) + b'; ' + n,
+}
+
+# The third put is a print; the first listing within the order's folder is the eighth.
+PRINT = 3
+MIDDLE = 12
+
+FTP = [
+    Fault('no fault', quick=True),
+    Fault('as installed, under TYPE A', only=('pure-ftpd', 'proftpd'), as_installed=True, heals=False),
+    # the way to the server
+    Fault('nobody listens', host='closed', only=('scripted',)),
+    Fault('a black hole', host='blackhole', only=('scripted',), clock=60, limit=150),
+    Fault('IPv6 only', host='ipv6'),
+    Fault('connects and stays silent', {'CONNECT': hang}, clock=120, limit=150, only=('scripted',)),
+    Fault('connects and stays silent, twice', {'CONNECT': (hang, 2, 3)}, clock=20),
+    Fault('too many clients, twice', {'CONNECT': (bye('421 Too many connections'), 2, 2)}),
+    Fault('too many clients, always', {'CONNECT': bye('421 Too many connections')}),
+    Fault('one connection for each address', {'CONNECT': refuse_second}),
+    Fault('login refused', {'PASS': reply('530 Login incorrect')}),
+    Fault('login refused, then not', {'PASS': (reply('530 Login incorrect'), 3, 4)}, quick=True),
+    Fault('wants encryption', {'USER': reply('550 SSL/TLS required on the control channel')}),
+    Fault('greeting of several lines', {'GREETING': passed(answer=many_lines)}),
+    Fault('replies of several lines', at_each(passed(answer=many_lines), 'GREETING USER PASS PWD TYPE CWD MKD DELE SIZE STOR LIST'),
+          quick=True),
+    Fault('half a second a command', at_each(late(0.05)), limit=120),
+    Fault('reset at QUIT', {'QUIT': cut}),
+    Fault('closes behind each listing', {'LIST': forward_and_close}),
+    # the way to the folder
+    Fault('login folder /home/lab', {'PWD': passed(answer=lambda text: text.replace('"/', '"/home/lab/', 1))}),
+    Fault('no folder can be made', {'MKD': reply('550 Create directory operation failed')}),
+    Fault('a folder is made at the second time', {'MKD': (reply('550 Create directory operation failed'), 1)}),
+    Fault('the folder cannot be entered, once', {'CWD': (reply('550 Failed to change directory'), 1, 4)}),
+    Fault('another order in the folder', {'CONNECT': (foreign_order, 1)}, only=('scripted',)),
+    Fault('a stray file in the folder', {'STOR': (put_stray, 1, 2)}, quick=True),
+    # the data line
+    Fault('no EPSV', no_epsv()),
+    Fault('no EPSV, PASV with a foreign address',
+          no_epsv(passed(answer=lambda text: text.replace('127,0,0,1', '192,0,2,7')), '522 not for this network')),
+    Fault('no EPSV, PASV without parentheses', no_epsv(passed(answer=without_parentheses))),
+    Fault('no passive', no_epsv(reply('550 Permission denied'))),
+    Fault('30 kB/s', {'STOR': passed(rate=300_000)}, limit=120),
+    # a put that is refused
+    Fault('STOR refused, once', {'STOR': (reply('550 Permission denied'), 1, PRINT)}),
+    Fault('STOR refused, always', {'STOR': (reply('553 Could not create file'), ALWAYS, PRINT)}),
+    Fault('STOR answered 421, once', {'STOR': (bye('421 Timeout'), 1, PRINT)}),
+    Fault('control line cut at STOR', {'STOR': (cut, 1, PRINT)}),
+    # a put that is cut
+    Fault('data line cut, once', {'STOR': (passed(cut=20_000), 1, PRINT)}, quick=True),
+    Fault('data line cut, four times', {'STOR': (passed(cut=20_000), 4, PRINT)}),
+    Fault('data line cut, always', {'STOR': (passed(cut=20_000), ALWAYS, PRINT)}),
+    Fault('data line cut, and 226', {'STOR': (passed(cut=20_000, reset_server=False, answer=lambda text: '226 done'), 1, PRINT)}),
+    Fault('data and control line cut', {'STOR': (passed(cut=20_000, answer=lambda text: ''), 1, PRINT)}),
+    Fault('data line cut, DELE refused',
+          {'STOR': (passed(cut=20_000), 1, PRINT), 'DELE': reply('550 Permission denied')}),
+    Fault('226 lost, once', {'STOR': (closing(''), 1, PRINT)}, again=True, quick=True),
+    Fault('226 lost, always', {'STOR': (closing(''), ALWAYS, PRINT)}, again=True),
+    Fault('silence behind 150', {'STOR': (passed(stall=0), 1, PRINT)}, clock=20),
+    Fault('silence in mid-file', {'STOR': (passed(stall=20_000), 1, PRINT)}, clock=20),
+    Fault('silence before 226', {'STOR': (hang_before_the_end, 1, PRINT)}, clock=20, again=True),
+    # a full server
+    Fault('disk full from the third file on', {'STOR': (passed(cut=20_000, answer=lambda text: '452 No space'), ALWAYS, PRINT)}),
+    Fault('451 behind the data, once', {'STOR': (closing('451 Failure writing to local file'), 1, PRINT)}, again=True),
+    Fault('552 behind the data, the file gone', {'STOR': (then_gone('552 Quota exceeded'), ALWAYS, PRINT)}),
+    Fault('552 behind the data, the file gone, once', {'STOR': (then_gone('552 Quota exceeded'), 1, PRINT)}),
+    # a put that is answered well
+    Fault('226, the file is empty', {'STOR': (passed(change=lambda content: b''), 1, PRINT)}),
+    Fault('226, the file is half', {'STOR': (passed(change=half), 1, PRINT)}, quick=True),
+    Fault('226, the file is half, always', {'STOR': (passed(change=half), ALWAYS, PRINT)}),
+    Fault('226, the last byte is missing', {'STOR': (passed(change=lambda content: content[:-1]), 1, PRINT)}),
+    Fault('226, the file is half, SIZE refused',
+          {'STOR': (passed(change=half), 1, PRINT), 'SIZE': reply('550 SIZE not allowed in ASCII mode')}),
+    Fault('226, the file is half, SIZE refused, bare names',
+          {'STOR': (passed(change=half), 1, PRINT), 'SIZE': reply('500 unknown'), 'LIST': lines_as(LISTINGS['bare names'])},
+          literal='no length is to be had'),
+    Fault('226, the file is gone', {'STOR': (then_gone(), 1, PRINT)}),
+    Fault('226, the file is gone, and a stray one there',
+          {'STOR': (then_gone(), 1, PRINT), 'EPSV': (put_stray, 1, 10)}),
+    Fault('CR dropped', {'STOR': passed(change=lambda content: content.replace(b'\r', b''))}, heals=False),
+    Fault('CRLF to LF', {'STOR': passed(change=lambda content: content.replace(b'\r\n', b'\n'))}, heals=False),
+    Fault('LF to CRLF', {'STOR': passed(change=lambda content: content.replace(b'\n', b'\r\n'))}, heals=False),
+    Fault('names in small letters', {'STOR': stored_as(str.lower)}, heals=False),
+    Fault('"^" stored as "_"', {'STOR': stored_as(lambda name: name.replace('^', '_'))}, heals=False),
+    # listings
+    Fault('listing cut in half, once', {'LIST': (passed(change=half), 1, MIDDLE)}, again=True, quick=True),
+    Fault('listing empty, once', {'LIST': (passed(change=lambda content: b''), 1, MIDDLE)}, again=True),
+    Fault('listing reset, once', {'LIST': (passed(cut=40), 1, MIDDLE)}),
+    Fault('listing refused, once', {'LIST': (reply('425 Failed to establish connection'), 1, MIDDLE)}),
+    Fault('listing refused from the middle on', {'LIST': (reply('550 no'), ALWAYS, MIDDLE)}),
+    Fault('listing silent, once', {'LIST': (hang, 1, MIDDLE)}, clock=20),
+    Fault('450 for an empty folder', {'LIST': empty_is('450 No files found')}),
+    Fault('550 for an empty folder', {'LIST': empty_is('550 No files found')}),
+    Fault('10 s behind each listing whose data line stays open', {'LIST': passed(linger=1)}, limit=120),
+    Fault('"." and ".." in the listing',
+          {'LIST': passed(change=lambda content: b'drwxr-xr-x 2 lab lab 0 Nov 22 01:02 .\r\ndrwxr-xr-x 2 lab lab 0 Nov 22 01:02 ..\r\n'
+                          + content)}),
+    *[Fault(f'listing: {name}', {'LIST': lines_as(form)}) for name, form in LISTINGS.items()],
+]
+
+
+# --- the same for the web
+
+def stored(change=None, body=b'stored\r\n', status=200):
+    def act(session):
+        session.store(change)
+        session.answer(body, status)
+        return True
+    return act
+
+
+def says(body=b'', status=200, **more):
+    return lambda session: session.answer(body, status, **more) or True
+
+
+def drops(session):
+    drop(session.connection)
+    raise OSError
+
+
+def silent(session):
+    time.sleep(30)
+    raise OSError
+
+
+def stores_and_drops(session):
+    session.store()
+    drops(session)
+
+
+def lists(change):
+    return lambda session: session.make_list(change) or True
+
+
+def redirects(status):
+    return lambda session: session.answer(b'', status, Location=session.path + '&again=1') or True \
+        if 'again=1' not in session.path and '?' in session.path else False
+
+
+def without_end(session):
+    session.send_response_only(200)
+    session.end_headers()
+    try:
+        for _ in range(3000):
+            session.wfile.write(b'~~' * 8192)
+    finally:
+        session.close_connection = True
+
+
+def foreign_folder(session):
+    session.server.lab.put_foreign_order()
+
+
+def of_list(add):
+    """An answer with the list's own text and a false length."""
+    def act(session):
+        path = session.server.root / session.path.partition('/uploads/')[2]
+        session.close_connection = True
+        if path.is_file():
+            session.answer(path.read_bytes(), length=path.stat().st_size + add)
+        return path.is_file()
+    return act
+
+
+# The first list is asked for before anything is sent.
+FIRST = 2
+HTTP = [
+    Fault('no fault', quick=True),
+    Fault('half of a file stored, once', {'POST': (stored(half), 1, 2)}, quick=True),
+    Fault('half of a file stored, always', {'POST': (stored(half), ALWAYS, 2)}),
+    Fault('an empty file stored', {'POST': (stored(lambda content: b''), 1, 2)}),
+    Fault('200, nothing stored, once', {'POST': (says(b'Warning: POST Content-Length exceeds the limit'), 1, 2)}),
+    Fault('200, four files not stored', {'POST': (says(b'error=7'), 4)}, quick=True),
+    Fault('200, nothing is ever stored', {'POST': says(b'error=7')}),
+    Fault('413', {'POST': (says(b'too large', 413), ALWAYS, 2)}),
+    Fault('500, once', {'POST': (says(b'', 500), 1, 2)}),
+    Fault('500, always', {'POST': says(b'', 500)}),
+    Fault('POST: silence, once', {'POST': (silent, 1, 2)}, clock=20, limit=120),
+    Fault('POST: line cut, once', {'POST': (drops, 1, 2)}),
+    Fault('POST: stored, line cut, once', {'POST': (stores_and_drops, 1, 2)}),
+    Fault('POST: redirect 302', {'POST': redirects(302)}),
+    Fault('POST: redirect 307', {'POST': redirects(307)}),
+    Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}, again=True),
+    Fault('list script: 500, always', {'MAKELIST': (says(b'', 500), ALWAYS, FIRST)}, again=True),
+    Fault('list script: silence, once', {'MAKELIST': (silent, 1, FIRST)}, clock=20, limit=120, again=True),
+    Fault('list script: redirect', {'MAKELIST': redirects(302)}),
+    Fault('list with ".", a file not stored',
+          {'MAKELIST': lists(lambda entries: [*entries[:-1], '.', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 5)}),
+    Fault('list with parts of names, files not stored',
+          {'MAKELIST': lists(lambda entries: [*entries[:-1], *['jpp'] * 4, entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 3)}),
+    Fault('list with names in capitals', {'MAKELIST': lists(lambda entries: [*entries[:1], *map(str.upper, entries[1:-1]), entries[-1]])}),
+    Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}, again=True),
+    Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}, again=True),
+    Fault('list lacks a file, once', {'MAKELIST': (lists(lambda entries: [*entries[:2], *entries[3:]]), 1, FIRST)}, again=True),
+    Fault('list: redirect', {'FETCH': lambda session: session.answer(b'', 302, Location=session.path + '?again') or True
+                             if '?' not in session.path else False}),
+    Fault('list: 404, once', {'FETCH': (says(b'no such file', 404), 1, 4)}, again=True),
+    Fault('list: 404, always', {'FETCH': says(b'no such file', 404)}, again=True),
+    Fault('list: a page of words, 200', {'FETCH': (says(b'<html>This site is being worked on. Please come back.</html>'), 2, 3)}, again=True),
+    Fault('list without end', {'FETCH': (without_end, 2, 3)}, again=True, limit=120),
+    Fault('list: Content-Length too large', {'FETCH': (of_list(add=100), 2, 3)}, again=True, quick=True),
+    Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}, again=True),
+    Fault('no HEAD', {'HEAD': says(b'', 405)}),
+    Fault('no HEAD, half of a file stored', {'HEAD': says(b'', 405), 'POST': (stored(half), 1, 2)}, literal='no length is to be had'),
+    Fault('another order in the folder', {'MAKELIST': (foreign_folder, 1)}),
+    Fault('report: 500', {'REPORT': says(b'', 500), 'DONE': says(b'', 500)}),
+    Fault('report: silence', {'REPORT': silent, 'DONE': silent}, clock=60, limit=120),
+    Fault('report: line cut', {'REPORT': drops, 'DONE': drops}),
+]
