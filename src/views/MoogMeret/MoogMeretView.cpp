@@ -14,7 +14,7 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
     : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Sending);
     frame().content()->addLayout(
-        inRow(Space::Wide, {{makeOrders(), 5}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}, makeWays()}), 1);
+        inRow(Space::Wide, {{makeOrders(), 4}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}, makeWays()}), 1);
     makeBars();
     start();
 }

@@ -32,7 +32,7 @@ void Gauge::showSign(Mood mood) {
 }
 
 QSize Gauge::sizeHint() const {
-    return {m_theme.size(Extent::WideField), m_theme.size(Extent::WideField)};
+    return {m_theme.px(230), m_theme.px(230)};
 }
 
 QSize Gauge::minimumSizeHint() const {

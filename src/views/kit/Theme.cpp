@@ -37,7 +37,7 @@ int Theme::size(IconSize sign) const {
 }
 
 int Theme::size(Extent extent) const {
-    static constexpr int pixels[] = {120, 150, 230, 360, 680};
+    static constexpr int pixels[] = {120, 150, 210, 360, 680};
     return px(pixels[static_cast<int>(extent)]);
 }
 

@@ -49,7 +49,7 @@ int PictureCell::pictureSide() const {
 }
 
 void PictureCell::resizeEvent(QResizeEvent*) {
-    const int inset = theme().size(Space::Tight);
+    const int inset = theme().thick() + theme().hair();
     const int height = theme().key();
     Q_EMIT resized();
     m_strip->setGeometry(inset, rect().height() - inset - height, width() - 2 * inset, height);
