@@ -217,6 +217,8 @@ struct SessionState {
     std::int16_t TmunatPaar = 0;         // 1: adds a menu tile and a step behind preparation
     bool SplitPage = false;              // the finished orders lead to the pieces, an operator's tool
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
+    bool Careful = false;                // the guards of docs/guards.md are on
+    bool OperatorArea = true;            // a customer may open the hidden area of the sending page
 
     ClientProfile profile;
     OrderDetails shemot;

@@ -180,6 +180,9 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     EXPECT_EQ(texts(given), texts(builtIn));
     EXPECT_EQ(example.deployment.SugTzad, Deployment().SugTzad);
     EXPECT_EQ(example.deployment.programLetter, Deployment().programLetter);
+    // The two keys whose example is not the built-in value.
+    EXPECT_TRUE(given.Careful && !given.OperatorArea);
+    EXPECT_TRUE(!builtIn.Careful && builtIn.OperatorArea);
 }
 
 TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {

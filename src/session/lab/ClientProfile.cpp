@@ -46,6 +46,8 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.MinuyPaar = deployment.MinuyPaar;
     state.TmunatPaar = deployment.TmunatPaar;
     state.SplitPage = deployment.SplitPage;
+    state.Careful = deployment.Careful;
+    state.OperatorArea = deployment.OperatorArea;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.coupon.HaKoopon = deployment.HaKoopon;

@@ -27,6 +27,8 @@ struct Deployment {
     std::int16_t MinuyPaar = 1;
     bool SplitPage = false;
     std::int16_t SugTzad = 40;
+    bool Careful = false;
+    bool OperatorArea = true;
 
     QChar programLetter = u'C'; // letter of the program's own drive
     QString dataFolder;         // host folder behind it; empty: the user's data folder

@@ -224,6 +224,10 @@ std::vector<Row> rows() {
         {"Switches", "QuickOrder", yesNo<I>(at(&D::MinuyPaar), 1, 2)},
         {"Switches", "SplitPage", yesNo(at(&D::SplitPage), true, false)},
 
+        {"Guards", "Careful", yesNo(at(&D::Careful), true, false)},
+
+        {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
+
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",
          text(at(&D::dataFolder), u"the whole path of a folder, beginning with /, or empty"_s, u"(?s)(/.*)?"_s)},
