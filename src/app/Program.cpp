@@ -2,12 +2,16 @@
 
 #include "app/DesktopShell.h"
 #include "app/PageRegister.h"
+#include "common/HostFile.h"
+#include "platform/ForwardCall.h"
 #include "platform/Instances.h"
+#include "platform/NetworkCards.h"
 #include "platform/Platform.h"
 #include "platform/QtEventPump.h"
 #include "platform/SystemClock.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
+#include "platform/files/MarkedVolume.h"
 #include "platform/files/StatVolume.h"
 #include "platform/line/PocoInternet.h"
 #include "platform/line/SmtpMail.h"
@@ -24,17 +28,20 @@
 
 #include <cassert>
 #include <cstdio>
+#include <optional>
+#include <utility>
 
 namespace lumora {
 
 // In the order in which each stands on those before it.
 struct Program::Parts {
-    Parts(Deployment read, const HostPath& dataFolder, Internet* line)
+    Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line)
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
-        , instances(dataFolder)
-        , volume(drives)
+        , instances(std::move(run))
+        , fileSystem(drives)
+        , volume(fileSystem, dataFolder, NetworkCards())
         , internet({}, deployment.ftpType)
         , shell(drives)
         , chain(pump)
@@ -49,7 +56,8 @@ struct Program::Parts {
     Drives drives;
     Files files;
     Instances instances;
-    StatVolume volume;
+    StatVolume fileSystem;
+    MarkedVolume volume;
     SystemClock clock;
     QtEventPump pump;
     PocoInternet internet;
@@ -59,7 +67,23 @@ struct Program::Parts {
     MainWindow window;
     ScreenDialogs dialogs;
     Platform platform;
+    std::optional<ForwardCalls> forwardCalls;
 };
+
+namespace {
+
+// Only there a program may raise its own window.
+bool displayAllowsRaising() {
+    return QGuiApplication::platformName() == QLatin1String("xcb");
+}
+
+void bringForward(QWidget& window) {
+    window.setWindowState((window.windowState() & ~Qt::WindowMinimized) | Qt::WindowActive);
+    window.raise();
+    window.activateWindow();
+}
+
+} // namespace
 
 Program::Program(ProgramOptions options)
     : m_options(std::move(options)) {}
@@ -78,6 +102,8 @@ Result<void> Program::start() {
         std::fprintf(stderr, "lumora: %s\n", qPrintable(warning));
     if (!reading.errors.isEmpty())
         return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
+    if (m_options.operatorArea)
+        reading.deployment.OperatorArea = true;
 
     HostPath dataFolder = Drives::defaultDataFolder();
     if (m_options.dataFolder)
@@ -95,7 +121,19 @@ Result<void> Program::start() {
     if (made)
         std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
 
-    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, m_options.internet);
+    const auto startTime = std::filesystem::file_time_type::clock::now();
+    Instances run(dataFolder, reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared);
+    if (run.refused()) {
+        m_otherCameForward = CallForward(dataFolder);
+        return Failure{
+            Failure::Kind::InUse,
+            QStringLiteral("%1: the program is already running with this data folder; only one may at a time")
+                .arg(toText(dataFolder))};
+    }
+    if (!run.another())
+        removeLeftovers(dataFolder, startTime);
+
+    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     registerViews(parts.window, parts.chain, parts.state, parts.files);
@@ -114,6 +152,8 @@ Result<void> Program::start() {
         parts.window.showFullScreen();
     else
         parts.window.show();
+    if (displayAllowsRaising())
+        parts.forwardCalls.emplace(dataFolder, [&parts] { bringForward(parts.window); });
     return {};
 }
 

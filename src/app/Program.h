@@ -22,6 +22,7 @@ struct ProgramOptions {
     std::optional<HostPath> dataFolder; // what stands behind the program's own drive letter
     QSize windowSize;                   // an empty one leaves the size to the screen
     bool fullScreen = false;
+    bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
     Internet* internet = nullptr; // in place of the machine's own line
 };
 
@@ -35,8 +36,12 @@ public:
     Program& operator=(const Program&) = delete;
 
     // Reads the deployment file, opens the window and brings the start page to the front. A failure tells file,
-    // line, key and what is allowed, and no window was opened then. The end of the page chain quits the application.
+    // line, key and what is allowed, and no window was opened then; InUse: another run has the data folder. The end of
+    // the page chain quits the application.
     Result<void> start();
+
+    // Behind an InUse: the other run has been asked to come to the front, and its display lets it.
+    bool otherCameForward() const { return m_otherCameForward; }
 
     // Valid once start() has succeeded.
     SessionState& state();
@@ -49,6 +54,7 @@ private:
     struct Parts;
     ProgramOptions m_options;
     std::unique_ptr<Parts> m_parts;
+    bool m_otherCameForward = false;
 };
 
 } // namespace lumora

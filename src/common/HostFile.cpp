@@ -9,11 +9,15 @@
 #include <cerrno>
 #include <cstring>
 #include <string>
+#include <string_view>
 #include <utility>
 
 namespace lumora {
 
 namespace {
+
+constexpr std::string_view temporaryPrefix = ".lumora-";
+constexpr std::string_view temporaryEnding = ".tmp";
 
 Failure::Kind kindOf(int error) {
     switch (error) {
@@ -113,8 +117,8 @@ NewContent::NewContent(std::filesystem::path target, QString path)
     , m_path(std::move(path)) {
     static std::atomic<unsigned> counter{0};
     do {
-        m_temporary = m_target.parent_path() /
-                      (".lumora-" + std::to_string(::getpid()) + "-" + std::to_string(counter++) + ".tmp");
+        m_temporary = m_target.parent_path() / (std::string(temporaryPrefix) + std::to_string(::getpid()) + "-" +
+                                                std::to_string(counter++) + std::string(temporaryEnding));
         m_file = Descriptor(::open(m_temporary.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666));
     } while (!m_file.valid() && errno == EEXIST);
     if (!m_file.valid()) {
@@ -161,6 +165,22 @@ Result<void> NewContent::commit(Durability durability) {
     if (folder.valid())
         ::fsync(folder.number());
     return {};
+}
+
+int removeLeftovers(const std::filesystem::path& folder, std::filesystem::file_time_type before) {
+    namespace fs = std::filesystem;
+    int removed = 0;
+    std::error_code error;
+    for (fs::recursive_directory_iterator at(folder, fs::directory_options::skip_permission_denied, error), end;
+         !error && at != end; at.increment(error)) {
+        const std::string name = at->path().filename().native();
+        if (!name.starts_with(temporaryPrefix) || !name.ends_with(temporaryEnding))
+            continue;
+        std::error_code gone;
+        if (at->is_regular_file(gone) && at->last_write_time(gone) < before && !gone && fs::remove(at->path(), gone))
+            ++removed;
+    }
+    return removed;
 }
 
 Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path) {

@@ -70,6 +70,10 @@ private:
 };
 
 inline constexpr qint64 toTheEnd = std::numeric_limits<qint64>::max();
+// Takes away what ended programs have left of files they were writing, in this folder and all below it; links are not
+// followed. Only what is older than the given time, and how many there were. No program may be at work in the folder.
+int removeLeftovers(const std::filesystem::path& folder, std::filesystem::file_time_type before);
+
 // Appends the next bytes of the source, up to count of them, and tells how many there were. Stops early when the target
 // has failed, which its commit tells.
 Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path);

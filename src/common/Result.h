@@ -22,6 +22,7 @@ struct Failure {
         Refused,      // the other side answered no
         Disconnected, // no line, or the line was cut
         TimedOut,
+        InUse, // another program has it
         Other,
     };
     Kind kind = Kind::Other;

@@ -2,6 +2,8 @@
 
 #include <fcntl.h>
 
+#include <cerrno>
+
 namespace lumora {
 
 namespace {
@@ -15,11 +17,11 @@ struct flock wholeFile(short kind) {
 
 } // namespace
 
-Instances::Instances(const HostPath& dataFolder)
+Instances::Instances(const HostPath& dataFolder, Lock lock)
     : m_file(::open((dataFolder / ".lumora-runs").c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)) {
-    struct flock mine = wholeFile(F_RDLCK);
-    if (m_file.valid())
-        (void)::fcntl(m_file.number(), F_OFD_SETLK, &mine);
+    struct flock mine = wholeFile(lock == Lock::Exclusive ? F_WRLCK : F_RDLCK);
+    if (m_file.valid() && ::fcntl(m_file.number(), F_OFD_SETLK, &mine) != 0)
+        m_refused = errno == EAGAIN || errno == EACCES;
 }
 
 bool Instances::another() const {

@@ -5,17 +5,23 @@
 
 namespace lumora {
 
-// The running instances of the program on one data folder. Each object holds a shared lock on a hidden file there,
-// which the system releases when the process ends, so that a page can ask whether another instance would disturb it.
+// The running instances of the program on one data folder. Each object holds a lock on a hidden file there, which the
+// system releases when the process ends, so that a page can ask whether another instance would disturb it, and a start
+// can be refused.
 class Instances {
 public:
-    explicit Instances(const HostPath& dataFolder);
+    enum class Lock { Shared, Exclusive };
+    explicit Instances(const HostPath& dataFolder, Lock lock = Lock::Shared);
+
+    // True where the lock of another instance excludes this one. False also when the folder takes no lock.
+    bool refused() const { return m_refused; }
 
     // True while another instance holds the lock. False also when the folder takes no lock.
     bool another() const;
 
 private:
     Descriptor m_file;
+    bool m_refused = false;
 };
 
 } // namespace lumora

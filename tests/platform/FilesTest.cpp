@@ -1,4 +1,6 @@
 #include "platform/files/Files.h"
+
+#include "common/HostFile.h"
 #include "support/SmallDisk.h"
 
 #include <QTemporaryDir>
@@ -100,6 +102,9 @@ TEST_F(FilesTest, MakesFoldersForTheirOwnerOnly) {
     EXPECT_EQ(files.makeFolder(u"C:\\no\\parent"_s).failure().kind, Failure::Kind::NotFound);
     put("afile");
     EXPECT_FALSE(files.makeFolder(u"C:\\afile"_s));
+    EXPECT_TRUE(*files.makeNewFolder(u"C:\\claimed"_s));
+    EXPECT_FALSE(*files.makeNewFolder(u"C:\\claimed"_s));
+    EXPECT_FALSE(files.makeNewFolder(u"C:\\no\\parent"_s).ok());
 }
 
 TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
@@ -110,6 +115,29 @@ TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
     const QStringList listed = files.names(u"C:\\"_s, u"*.jpg"_s);
     ASSERT_EQ(listed.size(), 1);
     EXPECT_TRUE(files.removeFile(u"C:\\"_s + listed[0]));
+}
+
+TEST_F(FilesTest, NeverListsWhatIsHiddenAndTakesWhatAKillLeftAtTheNextStart) {
+    const char* leftBehind[] = {"order/.lumora-4711-0.tmp", "order/deep/.lumora-4711-12.tmp", ".lumora-1-1.tmp"};
+    const char* kept[] = {".lumora-runs", "order/.order", "order/lumora-1-1.tmp", "order/a.jpp", "order/.lumora-notes"};
+    for (const char* name : leftBehind)
+        put(name);
+    for (const char* name : kept)
+        put(name);
+    fs::create_directory(data / "order" / ".kept");
+    put("order/.kept/one.bmp");
+    EXPECT_EQ(files.names(u"C:\\order"_s, u"*.*"_s), QStringList({u"a.jpp"_s, u"lumora-1-1.tmp"_s}));
+    EXPECT_EQ(files.folders(u"C:\\order"_s), QStringList(u"deep"_s));
+    EXPECT_EQ(files.collect(u"C:\\order"_s, Files::Depth::WithSubfolders),
+              QStringList({u"C:\\order\\a.jpp"_s, u"C:\\order\\lumora-1-1.tmp"_s}));
+
+    const auto now = fs::file_time_type::clock::now();
+    EXPECT_EQ(removeLeftovers(data, now - std::chrono::hours(1)), 0) << "a program may be writing it";
+    EXPECT_EQ(removeLeftovers(data, now + std::chrono::hours(1)), 3);
+    for (const char* name : leftBehind)
+        EXPECT_FALSE(fs::exists(data / name)) << name;
+    for (const char* name : kept)
+        EXPECT_TRUE(fs::exists(data / name)) << name;
 }
 
 TEST_F(FilesTest, FailsWithPathAndReason) {

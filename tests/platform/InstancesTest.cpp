@@ -23,4 +23,26 @@ TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAsLongAsBothAreThere) {
     EXPECT_FALSE(Instances("/proc/no such folder").another());
 }
 
+TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
+    using Lock = Instances::Lock;
+    struct Case {
+        Lock first, second;
+        bool refused;
+    };
+    for (const auto& [first, second, refused] : {Case{Lock::Exclusive, Lock::Exclusive, true},
+                                                 {Lock::Exclusive, Lock::Shared, true},
+                                                 {Lock::Shared, Lock::Exclusive, true},
+                                                 {Lock::Shared, Lock::Shared, false}}) {
+        const QTemporaryDir folder;
+        const QTemporaryDir elsewhere;
+        std::optional<Instances> one(std::in_place, folder.path().toStdString(), first);
+        EXPECT_FALSE(one->refused());
+        EXPECT_EQ(Instances(folder.path().toStdString(), second).refused(), refused);
+        EXPECT_FALSE(Instances(elsewhere.path().toStdString(), second).refused()) << "another data folder";
+        one.reset();
+        EXPECT_FALSE(Instances(folder.path().toStdString(), second).refused()) << "the first has ended";
+    }
+    EXPECT_FALSE(Instances("/proc/no such folder", Lock::Exclusive).refused());
+}
+
 } // namespace lumora

@@ -1,4 +1,8 @@
+#include "common/HostFile.h"
+#include "platform/ForwardCall.h"
+#include "platform/NetworkCards.h"
 #include "platform/QtEventPump.h"
+#include "platform/files/MarkedVolume.h"
 #include "platform/files/StatVolume.h"
 
 #include <QCoreApplication>
@@ -7,6 +11,8 @@
 #include <QTimer>
 
 #include <gtest/gtest.h>
+
+#include <fstream>
 
 namespace lumora {
 namespace {
@@ -45,6 +51,78 @@ TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
     EXPECT_EQ(serialOfUuid(u"F000-0001"_s), static_cast<std::int32_t>(0xF0000001U));
     EXPECT_NE(serialOfUuid(u"0a1b2c3d-0000-4000-8000-000000000001"_s),
               serialOfUuid(u"0a1b2c3d-0000-4000-8000-000000000002"_s));
+}
+
+class PlainVolume : public Volume {
+public:
+    Result<std::int32_t> serial(const QString&) const override { return 12345678; }
+};
+
+TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
+    const PlainVolume plain;
+    const QTemporaryDir folder;
+    const HostPath data = toHostPath(folder.path());
+    const QStringList here = {u"52:54:00:00:00:01"_s, u"52:54:00:00:00:02"_s};
+    const auto serial = [&](const QStringList& cards) { return *MarkedVolume(plain, data, cards).serial(u"C:\\"_s); };
+    const std::int32_t first = serial(here);
+    EXPECT_EQ(serial(here), first) << "at the next start";
+    EXPECT_EQ(serial({}), first) << "no card can be told";
+
+    // The image on another machine, and then on a third.
+    const std::int32_t second = serial({u"52:54:00:00:00:03"_s});
+    EXPECT_NE(second, first);
+    EXPECT_NE(serial({u"52:54:00:00:00:04"_s}), second);
+
+    // Another folder on the same volume and machine; a mark that is no mark.
+    const QTemporaryDir other;
+    const MarkedVolume beside(plain, toHostPath(other.path()), here);
+    const std::int32_t another = *beside.serial(u"C:\\"_s);
+    EXPECT_NE(another, first);
+    ASSERT_TRUE(writeWholeFile(toHostPath(other.path()) / ".lumora-mark", "\"Mark\",\"x\"\r\n"));
+    EXPECT_NE(*beside.serial(u"C:\\"_s), another);
+
+    EXPECT_EQ(*MarkedVolume(plain, "/proc/none", here).serial(u"C:\\"_s), 12345678) << "a mark that can't be kept";
+}
+
+TEST(NetworkCards, AreTheBuiltInOnesByTheirAddress) {
+    const QTemporaryDir folder;
+    const HostPath root = toHostPath(folder.path());
+    namespace fs = std::filesystem;
+    const auto put = [&](const std::string& name, const std::string& address, const char* bus) {
+        fs::create_directories(root / "net" / name);
+        std::ofstream(root / "net" / name / "address") << address << '\n';
+        if (!bus)
+            return;
+        fs::create_directories(root / "bus" / bus);
+        fs::create_directories(root / "net" / name / "device");
+        fs::create_directory_symlink(root / "bus" / bus, root / "net" / name / "device" / "subsystem");
+    };
+    EXPECT_EQ(NetworkCards(root / "none"), QStringList());
+    put("lumoraLo", "00:00:00:00:00:00", nullptr);
+    put("lumoraBridge", "52:54:00:00:00:09", nullptr);
+    put("lumoraPlug", "52:54:00:00:00:05", "usb");
+    EXPECT_EQ(NetworkCards(root / "net"), QStringList(u"52:54:00:00:00:05"_s));
+    put("lumoraCard2", "52:54:00:00:00:0B", "pci");
+    put("lumoraCard1", "52:54:00:00:00:0a", "virtio");
+    put("lumoraNone", "00:00:00:00:00:00", "pci");
+    EXPECT_EQ(NetworkCards(root / "net"), QStringList({u"52:54:00:00:00:0a"_s, u"52:54:00:00:00:0b"_s}));
+}
+
+TEST(ForwardCalls, ReachTheRunOfTheSameFolderAsLongAsItLives) {
+    const QTemporaryDir folder;
+    const QTemporaryDir elsewhere;
+    int called = 0;
+    {
+        const ForwardCalls calls(toHostPath(folder.path()), [&] { ++called; });
+        EXPECT_FALSE(CallForward(toHostPath(elsewhere.path())));
+        EXPECT_TRUE(CallForward(toHostPath(folder.path()) / "."));
+        QElapsedTimer waiting;
+        waiting.start();
+        while (called == 0 && waiting.elapsed() < 5000)
+            QCoreApplication::processEvents();
+        EXPECT_EQ(called, 1);
+    }
+    EXPECT_FALSE(CallForward(toHostPath(folder.path())));
 }
 
 } // namespace

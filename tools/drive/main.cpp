@@ -13,6 +13,7 @@ namespace {
 
 constexpr int aLineFailed = 1;
 constexpr int notPlayed = 2;
+constexpr int alreadyRunning = 3;
 
 int complain(const QString& text, int status) {
     std::fprintf(stderr, "%s\n", qUtf8Printable(text));
@@ -40,7 +41,8 @@ int play(int argc, char** argv) {
                        "a line:\n\n") +
         scenarioHelp() +
         QStringLiteral("\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n"
-                       "Exit status: 0 all held, 1 a line failed, 2 nothing could be played."));
+                       "Exit status: 0 all held, 1 a line failed, 2 nothing could be played, 3 another program "
+                       "has the data folder."));
     parser.addHelpOption();
     parser.addVersionOption();
     parser.addOptions(
@@ -79,7 +81,8 @@ int play(int argc, char** argv) {
 
     Program program(options);
     if (const Result<void> started = program.start(); !started)
-        return complain(started.failure().message, notPlayed);
+        return complain(started.failure().message,
+                        started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
     ScenarioPlayer player(program, std::move(files), parser.value(QStringLiteral("shots")));
     QObject::connect(&player, &ScenarioPlayer::finished, &application, &QCoreApplication::quit);
     player.start();

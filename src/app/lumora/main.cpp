@@ -11,6 +11,14 @@
 
 using namespace lumora;
 
+namespace {
+
+// Exit statuses.
+constexpr int notStarted = 2;
+constexpr int alreadyRunning = 3;
+
+} // namespace
+
 int main(int argc, char** argv) {
     keepPictureMemory();
     // Help needs no screen.
@@ -31,14 +39,16 @@ int main(int argc, char** argv) {
                                  QStringLiteral("FILE"));
     const QCommandLineOption window(QStringLiteral("window"),
                                     QStringLiteral("Run in a window, not over the whole screen."));
-    parser.addOptions({help, version, lab, window});
+    const QCommandLineOption area(QStringLiteral("operator"),
+                                  QStringLiteral("Open the hidden area of the sending page, for the lab's people."));
+    parser.addOptions({help, version, lab, window, area});
     if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
         std::fprintf(
             stderr, "lumora: %s\n",
             qPrintable(parser.errorText().isEmpty()
                            ? QStringLiteral("unexpected argument '%1'").arg(parser.positionalArguments().first())
                            : parser.errorText()));
-        return 2;
+        return notStarted;
     }
     if (parser.isSet(help)) {
         std::fputs(qPrintable(parser.helpText()), stdout);
@@ -53,11 +63,13 @@ int main(int argc, char** argv) {
     if (parser.isSet(lab))
         options.labFile = toHostPath(parser.value(lab));
     options.fullScreen = !parser.isSet(window);
+    options.operatorArea = parser.isSet(area);
     Program program(std::move(options));
     if (const Result<void> started = program.start(); !started) {
         std::fprintf(stderr, "lumora: %s\n", qPrintable(started.failure().message));
-        showStartFailure(started.failure().message);
-        return 2;
+        if (!program.otherCameForward())
+            showStartFailure(started.failure().message);
+        return started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notStarted;
     }
     return QCoreApplication::exec();
 }

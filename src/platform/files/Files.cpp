@@ -136,6 +136,17 @@ Result<void> Files::makeFolder(const QString& path) const {
     return systemFailure(errno, path);
 }
 
+Result<bool> Files::makeNewFolder(const QString& path) const {
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    if (::mkdir(found->c_str(), 0700) == 0)
+        return true;
+    if (errno == EEXIST)
+        return false;
+    return systemFailure(errno, path);
+}
+
 Result<void> Files::removeFile(const QString& path) const {
     const auto found = host(path);
     if (!found)

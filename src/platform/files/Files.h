@@ -24,6 +24,8 @@ public:
 
     // Succeeds when the folder exists. The parent must exist.
     Result<void> makeFolder(const QString& path) const;
+    // True if this call made it, false if something of that name is there: of two programs one alone gets the true.
+    Result<bool> makeNewFolder(const QString& path) const;
     Result<void> removeFile(const QString& path) const;
 
     Result<QByteArray> read(const QString& path) const;

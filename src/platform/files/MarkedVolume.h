@@ -1,0 +1,29 @@
+#pragma once
+
+#include "platform/Machine.h"
+#include "platform/files/HostPath.h"
+
+#include <QStringList>
+
+namespace lumora {
+
+// The serial of a volume mixed with a random mark of the data folder, so that two data folders on one volume, and two
+// machines with one image, make different folders on the lab's server. The mark is kept in the hidden file
+// .lumora-mark together with the hardware addresses of this machine's network cards, and made anew where those are not
+// the same: an image copies all the rest. Where the mark can't be kept, the serial stays as the volume has it.
+class MarkedVolume : public Volume {
+public:
+    MarkedVolume(const Volume& volume, HostPath dataFolder, QStringList networkCards)
+        : m_volume(volume)
+        , m_file(std::move(dataFolder) / ".lumora-mark")
+        , m_cards(std::move(networkCards)) {}
+
+    Result<std::int32_t> serial(const QString& driveRoot) const override;
+
+private:
+    const Volume& m_volume;
+    HostPath m_file;
+    QStringList m_cards;
+};
+
+} // namespace lumora
