@@ -62,18 +62,24 @@ void PreparationPage::addFailed(const QString& path) {
     Q_EMIT changed();
 }
 
-void PreparationPage::takeNumber(OrderFolder::Ending ending) {
-    m_state.MisparHazmana = freeOrderNumber(m_state, m_platform.files, ending);
-}
-
-bool PreparationPage::openFolder(const OrderFolder& folder) {
-    m_state.transfer.OrderFolder = folder.path();
-    const Result<void> made = makeOrderFolder(m_platform.files, folder);
-    if (!made)
+std::optional<OrderFolder> PreparationPage::claimFolder(OrderFolder::Ending ending) {
+    const Files& files = m_platform.files;
+    const OrderFolder same = OrderFolder::inPreparation(m_state, ending);
+    if (m_claimed && m_claimed->path() == same.path()) {
+        for (const QString& name : files.names(same.path(), QStringLiteral("*.jpp")))
+            static_cast<void>(files.removeFile(same.filePath(name)));
+        return same;
+    }
+    const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
+    if (!claimed) {
         tell(QStringLiteral("לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."),
              QStringLiteral("The order's folder can't be made. Free some space or mend the rights, then try again."),
-             made.failure().message);
-    return made.ok();
+             claimed.failure().message);
+        return std::nullopt;
+    }
+    m_claimed = *claimed;
+    m_state.transfer.OrderFolder = claimed->path();
+    return m_claimed;
 }
 
 bool PreparationPage::forEachPicture(const std::function<void(int)>& step) {

@@ -11,6 +11,7 @@
 #include "session/TextList.h"
 
 #include <functional>
+#include <optional>
 
 namespace lumora {
 
@@ -72,10 +73,9 @@ protected:
     virtual void showProgress();
     void addFailed(const QString& path);
 
-    // Takes a number that is free and opens its folder, which the senders are told too. No value, with words, when the
-    // folder can't be made.
-    void takeNumber(OrderFolder::Ending ending);
-    bool openFolder(const OrderFolder& folder);
+    // Claims a number that is free by making its folder, which the senders are told too. A second start of this page
+    // keeps number and folder, less the print files of the first. No value, with words, when the folder can't be made.
+    std::optional<OrderFolder> claimFolder(OrderFolder::Ending ending);
     // step() for each line of List1, the page painted behind each. False when a click ended the program.
     bool forEachPicture(const std::function<void(int)>& step);
     // Adds what could not be packed to List4fail and says why, once for a whole order.
@@ -105,6 +105,7 @@ private:
     int m_count = 0;
     bool m_preparing = false;
     bool m_handedOver = false;
+    std::optional<OrderFolder> m_claimed;
 };
 
 } // namespace lumora

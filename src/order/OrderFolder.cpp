@@ -10,22 +10,23 @@
 namespace lumora {
 namespace {
 
-const QString printFiles = QStringLiteral("*.jpp");
-
 QString pathOf(const SessionState& state, const QString& number, OrderFolder::Ending ending) {
     const bool marked = ending == OrderFolder::Ending::BySession && state.transfer.HazmanaP > 0;
     const QString name = OrderName(state.shemot.TimeOfJob, number);
     return JoinDrivePath(WorkspacePaths::orders(state), marked ? name + u'P' : name);
 }
 
-bool isFree(const Files& files, const OrderFolder& folder) {
-    if (!files.folderExists(folder.path()))
-        return true;
-    if (files.fileExists(folder.logPath()))
-        return false;
-    for (const QString& name : files.names(folder.path(), printFiles))
-        static_cast<void>(files.removeFile(folder.filePath(name)));
-    return files.names(folder.path(), printFiles).isEmpty();
+// The numbers of the orders without a log, each also without the "P" of its folder.
+QStringList numbersOfUnfinished(const SessionState& state, const Files& files) {
+    const QString orders = WorkspacePaths::orders(state);
+    QStringList numbers;
+    for (const QString& name : files.folders(orders)) {
+        if (files.fileExists(OrderFolder(JoinDrivePath(orders, name)).logPath()))
+            continue;
+        const QString number = OrderNumberOf(name);
+        numbers += TravelsInPieces(number) ? number.chopped(1) : number;
+    }
+    return numbers;
 }
 
 } // namespace
@@ -50,11 +51,25 @@ QString OrderFolder::filePath(const QString& fileName) const {
     return JoinDrivePath(m_path, fileName);
 }
 
-QString freeOrderNumber(const SessionState& state, const Files& files, OrderFolder::Ending ending) {
-    QString number = state.MisparHazmana;
-    while (!isFree(files, OrderFolder(pathOf(state, number, ending))))
-        number = QString::number(Val(number) + 1.0, 'f', 0);
-    return number;
+Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, OrderFolder::Ending ending) {
+    const QString orders = WorkspacePaths::orders(state);
+    for (const QString& path : {ParentFolder(orders), orders}) {
+        if (const Result<void> made = files.makeFolder(path); !made)
+            return made.failure();
+    }
+    const QStringList taken = numbersOfUnfinished(state, files);
+    for (QString number = state.MisparHazmana;; number = QString::number(Val(number) + 1.0, 'f', 0)) {
+        if (taken.contains(number))
+            continue;
+        const OrderFolder folder(pathOf(state, number, ending));
+        const Result<bool> made = files.makeNewFolder(folder.path());
+        if (!made)
+            return made.failure();
+        if (!*made)
+            continue;
+        state.MisparHazmana = number;
+        return folder;
+    }
 }
 
 Result<void> makeOrderFolder(const Files& files, const OrderFolder& folder) {

@@ -39,10 +39,10 @@ private:
     QString m_path;
 };
 
-// The first number, from the session's on, whose folder is free. A folder without a log belongs to an order that was
-// given up: its print files are removed, and the number is taken if that succeeds. A folder with a log belongs to
-// another order, whose number came again because the counter was lost.
-QString freeOrderNumber(const SessionState& state, const Files& files, OrderFolder::Ending ending);
+// Makes the folder of a new order under the first number, from that of the session on, that no other order has, and
+// gives the session that number. Taken is a number whose folder of this name is there, and one of an order of any day
+// without a log: that order is unfinished, and its files stay. The failure names the folder that can't be made.
+Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, OrderFolder::Ending ending);
 
 // Makes the folder and its two parents where they are missing.
 Result<void> makeOrderFolder(const Files& files, const OrderFolder& folder);

@@ -248,8 +248,8 @@ TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
 }
 
 TEST_F(PreparingAnEditedOrder, keepsWhatWasPreparedWhenTheLogCanNotBeWritten) {
-    makeFolder(logPath());
     B3& page = open({edited(givePicture(u"one_1.jpg"_s))});
+    onceClaimed([&] { makeFolder(logPath()); });
     page.Timer2_Tick();
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"KUP_1234^105.txt"_s));

@@ -158,25 +158,32 @@ TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_s)) << "an abandoned order burns no number";
 }
 
-TEST_F(PreparingAPlainOrder, clearsTheFolderOfAnAbandonedOrderAndNeverJoinsAFinishedOne) {
-    makeFolder(folder());
-    ASSERT_TRUE(machine.files.writeWhole(folder() + u"\\9 1015GNB0009_0161.jpp"_s, "old"));
+TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinishedOrders) {
+    // One was given up today, one yesterday, before the counter was written.
+    const QStringList unfinished = {folder(), u"C:\\2000lumora\\!!000\\2026_11_20_KUP_1234^106"_s};
+    for (const QString& left : unfinished) {
+        makeFolder(left);
+        ASSERT_TRUE(machine.files.writeWhole(left + u"\\9 1015GNB0009_0161.jpp"_s, "old"));
+    }
     const QString picture = line(givePicture(u"one.jpg"_s));
     openWith({picture}).Command6_Click();
-    EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0000_016F6E65.jpp"_s));
+    EXPECT_EQ(state.MisparHazmana, u"107"_s);
+    EXPECT_EQ(printFiles(u"107"_s), QStringList(u"1 1015GNB0000_016F6E65.jpp"_s));
+    for (const QString& left : unfinished)
+        EXPECT_EQ(machine.files.names(left, u"*"_s), QStringList(u"9 1015GNB0009_0161.jpp"_s)) << left.toStdString();
 
     // The counter is lost, and the number comes again.
-    const QByteArray finished = *machine.files.read(logPath());
+    const QByteArray finished = *machine.files.read(logPath(u"107"_s));
     chain.unload(PageId::FtpFrm);
-    state.MisparHazmana = u"105"_s;
+    state.MisparHazmana = u"107"_s;
     openWith({picture, picture}).Command6_Click();
-    EXPECT_EQ(state.MisparHazmana, u"106"_s);
-    EXPECT_EQ(printFiles().size(), 1);
-    EXPECT_EQ(*machine.files.read(logPath()), finished);
-    EXPECT_EQ(printFiles(u"106"_s).size(), 2);
-    EXPECT_TRUE(machine.files.fileExists(folder(u"106"_s) + u"\\!106_1234.jpp"_s));
-    EXPECT_TRUE(machine.files.read(logPath(u"106"_s))->contains("KUP_1234^106\""));
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "107\r\n");
+    EXPECT_EQ(state.MisparHazmana, u"108"_s);
+    EXPECT_EQ(printFiles(u"107"_s).size(), 1);
+    EXPECT_EQ(*machine.files.read(logPath(u"107"_s)), finished);
+    EXPECT_EQ(printFiles(u"108"_s).size(), 2);
+    EXPECT_TRUE(machine.files.fileExists(folder(u"108"_s) + u"\\!108_1234.jpp"_s));
+    EXPECT_TRUE(machine.files.read(logPath(u"108"_s))->contains("KUP_1234^108\""));
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "109\r\n");
 }
 
 TEST_F(PreparingAPlainOrder, marksTheFolderOfAReopenedOrder) {
@@ -206,8 +213,8 @@ TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) 
 
 TEST_F(PreparingAPlainOrder, tellsOfAPrintFileThatCanNotBeWrittenAndGoesOn) {
     const QString one = givePicture(u"one.jpg"_s);
-    makeFolder(folder() + u"\\1 1015GNB0000_016F6E65.jpp"_s);
     Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
+    onceClaimed([&] { makeFolder(folder() + u"\\1 1015GNB0000_016F6E65.jpp"_s); });
     const TextList& failed = page.controls().List4fail;
     page.Command6_Click();
     EXPECT_EQ(failed.items(), QStringList(one));
@@ -219,8 +226,8 @@ TEST_F(PreparingAPlainOrder, tellsOfAPrintFileThatCanNotBeWrittenAndGoesOn) {
 
 TEST_F(PreparingAPlainOrder, goesOnWithoutTheCounterButNotWithoutTheLog) {
     makeFolder(u"C:\\vedron\\mispar.txt"_s);
-    makeFolder(logPath());
     Form2& page = openWith({line(givePicture(u"one.jpg"_s)), line(givePicture(u"two.jpg"_s))});
+    onceClaimed([&] { makeFolder(logPath()); });
     page.Command6_Click();
     ASSERT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"mispar.txt"_s));

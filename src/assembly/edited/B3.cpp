@@ -95,14 +95,13 @@ bool B3::prepareOrder() {
         return false;
     m_state.transfer.MailFlag = 0;
     countTotal();
-    takeNumber(OrderFolder::Ending::Plain);
-    const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::Plain);
-    if (!openFolder(folder))
+    const std::optional<OrderFolder> folder = claimFolder(OrderFolder::Ending::Plain);
+    if (!folder)
         return false;
 
     listNames();
     List1.setCurrentIndex(0);
-    PrintPacker packer(m_state, m_platform.files, folder, OrderTail::shortWidth);
+    PrintPacker packer(m_state, m_platform.files, *folder, OrderTail::shortWidth);
     {
         EditedPrints prints(m_state, m_platform.files, List1.items(), m_paper);
         if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
@@ -114,7 +113,7 @@ bool B3::prepareOrder() {
     if (!buildOrderSheet())
         return false;
     setStage(Stage::Closing);
-    return writeLog(folder, OrderLog::Layout::Edited);
+    return writeLog(*folder, OrderLog::Layout::Edited);
 }
 
 void B3::listNames() {

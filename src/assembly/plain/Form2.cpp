@@ -180,29 +180,28 @@ void Form2::keepOnlyJpeg() {
 
 bool Form2::prepareOrder() {
     // Before the sheet is drawn: it shows the number.
-    takeNumber(OrderFolder::Ending::BySession);
+    const std::optional<OrderFolder> folder = claimFolder(OrderFolder::Ending::BySession);
+    if (!folder)
+        return false;
     countTotal();
     if (!drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain))
         return false;
 
-    const OrderFolder folder = OrderFolder::inPreparation(m_state, OrderFolder::Ending::BySession);
-    if (!openFolder(folder))
-        return false;
     const QString sheetPath =
-        folder.filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, QStringLiteral(".jpp")));
+        folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, QStringLiteral(".jpp")));
     const Result<QByteArray> sheet = encodeJpeg(Picture5Image, printQuality);
     const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
     if (!saved)
         tellWriteFailure(saved.failure());
 
-    PrintPacker packer(m_state, m_platform.files, folder, m_state.SugTzad);
+    PrintPacker packer(m_state, m_platform.files, *folder, m_state.SugTzad);
     Prints prints(m_state, m_platform.files, List1.items());
     if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
         return false;
 
     setStage(Stage::Closing);
     countOrder();
-    return writeLog(folder, isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
+    return writeLog(*folder, isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
 }
 
 void Form2::packPicture(int index, PrintPacker& packer, Prints& prints) {
