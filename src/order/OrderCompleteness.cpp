@@ -1,0 +1,80 @@
+#include "order/OrderCompleteness.h"
+
+#include "order/OrderFolder.h"
+#include "order/OrderLog.h"
+#include "order/PieceName.h"
+#include "order/PrintFileName.h"
+#include "platform/files/Files.h"
+
+#include <QMap>
+#include <QSet>
+
+#include <algorithm>
+
+namespace lumora {
+namespace {
+
+int printsNamedBy(const OrderLog& log) {
+    int usable = 0;
+    for (qsizetype i = 0; i < log.items.size(); ++i)
+        usable += log.line(i).hasUsableName() ? 1 : 0;
+    return std::max(0, usable - static_cast<int>(log.failed.size()));
+}
+
+bool isWhole(const QSet<int>& sequence, int declared) {
+    int n = 0;
+    while (sequence.contains(n + 1))
+        ++n;
+    return n > 0 && n == sequence.size() && n >= declared - 1;
+}
+
+} // namespace
+
+QStringList PrintsAmong(const QStringList& names) {
+    QSet<QString> prints;
+    QMap<std::pair<QString, QString>, QSet<int>> families; // by joined name and declared total
+    for (const QString& name : names) {
+        if (PrintFileName::parse(name)) {
+            prints += name;
+            continue;
+        }
+        const std::optional<QString> joined = IsPiece(name) ? JoinedName(name) : std::nullopt;
+        if (joined && PrintFileName::parse(*joined))
+            families[{*joined, PieceTotal(name)}] += PieceSequence(name).toInt();
+    }
+    for (auto family = families.cbegin(); family != families.cend(); ++family) {
+        if (isWhole(family.value(), family.key().second.toInt()))
+            prints += family.key().first;
+    }
+    QStringList sorted(prints.begin(), prints.end());
+    sorted.sort();
+    return sorted;
+}
+
+OrderCompleteness::Verdict OrderCompleteness::verdict() const {
+    const int sent = std::min(present, marked);
+    if (sent == 0)
+        return Verdict::None;
+    if (!named)
+        return Verdict::Unknown;
+    return sent < *named ? Verdict::Fewer : Verdict::Whole;
+}
+
+OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& present, const QStringList& marked) {
+    OrderCompleteness counts;
+    if (log)
+        counts.named = printsNamedBy(*log);
+    counts.present = static_cast<int>(PrintsAmong(present).size());
+    counts.marked = static_cast<int>(PrintsAmong(marked).size());
+    return counts;
+}
+
+OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked) {
+    const QStringList present = files.names(folder.path(), QStringLiteral("*.jpp;*.prk"));
+    OrderLog log;
+    if (const Result<QByteArray> bytes = files.read(folder.logPath()))
+        log.read(*bytes);
+    return of(log.Hazmana.isEmpty() ? nullptr : &log, present, marked);
+}
+
+} // namespace lumora

@@ -1,0 +1,173 @@
+#include "order/OrderState.h"
+
+#include "common/FixedText.h"
+#include "order/OrderFolder.h"
+#include "platform/files/Files.h"
+
+#include <array>
+#include <optional>
+#include <utility>
+
+namespace lumora {
+namespace {
+
+constexpr std::array phases = {"preparing", "prepared", "sending", "arrived", "reported"};
+constexpr std::array ways = {"ftp", "http", "station", "mail"};
+constexpr std::array reports = {"not yet", "begun", "done"};
+
+const QString choicePrefix = QStringLiteral("Choice.");
+const QString lastKey = QStringLiteral("End");
+
+QString statePath(const OrderFolder& folder) {
+    return folder.filePath(QStringLiteral(".order"));
+}
+
+// A caption may hold line breaks, and behind a quote a break would end the line.
+QString withoutBreaks(QString text) {
+    return text.replace(u'%', QStringLiteral("%25"))
+        .replace(u'\r', QStringLiteral("%0D"))
+        .replace(u'\n', QStringLiteral("%0A"));
+}
+
+QString withBreaks(QString text) {
+    return text.replace(QStringLiteral("%0A"), QStringLiteral("\n"))
+        .replace(QStringLiteral("%0D"), QStringLiteral("\r"))
+        .replace(QStringLiteral("%25"), QStringLiteral("%"));
+}
+
+class StateWriter {
+public:
+    void text(const QString& key, const QString& value) {
+        m_output.pair(withoutBreaks(key), withoutBreaks(value));
+        ++m_lines;
+    }
+    template <std::size_t N, class Enum>
+    void word(const char* key, const std::array<const char*, N>& words, Enum value) {
+        text(QLatin1StringView(key), QLatin1StringView(words[static_cast<std::size_t>(value)]));
+    }
+    void truth(const char* key, bool value) { text(QLatin1StringView(key), value ? u"yes" : u"no"); }
+
+    QByteArray end() {
+        m_output.text(lastKey).number(m_lines).endLine();
+        return m_output.bytes();
+    }
+
+private:
+    void text(QLatin1StringView key, QStringView value) { text(QString(key), value.toString()); }
+    void text(QLatin1StringView key, QLatin1StringView value) { text(QString(key), QString(value)); }
+
+    ListOutput m_output;
+    int m_lines = 0;
+};
+
+template <std::size_t N, class Enum>
+bool takeWord(const std::array<const char*, N>& words, const QString& value, Enum& taken) {
+    for (std::size_t i = 0; i < N; ++i) {
+        if (value == QLatin1StringView(words[i])) {
+            taken = static_cast<Enum>(i);
+            return true;
+        }
+    }
+    return false;
+}
+
+bool takeTruth(const QString& value, bool& taken) {
+    taken = value == u"yes";
+    return taken || value == u"no";
+}
+
+// False for a value that this version can't take.
+bool takeEntry(OrderState& state, const QString& key, const QString& value) {
+    if (key == u"Phase")
+        return takeWord(phases, value, state.phase);
+    if (key == u"Way")
+        return takeWord(ways, value, state.way);
+    if (key == u"Report")
+        return takeWord(reports, value, state.report);
+    if (key == u"FolderMadeByUs")
+        return takeTruth(value, state.folderMadeByUs);
+    if (key == u"ProvenByNameOnly")
+        return takeTruth(value, state.provenByNameOnly);
+    if (key == u"MisparHazmana")
+        state.number = value;
+    else if (key == u"Shemot.ser")
+        state.serial = value;
+    else if (key == u"Optint")
+        state.kind = static_cast<OrderKind>(Val16(value));
+    else if (key == u"InHand")
+        state.filesInHand += value;
+    else if (key == u"Shoora")
+        state.items += value;
+    else if (key.startsWith(choicePrefix))
+        state.choices += {key.mid(choicePrefix.size()), value};
+    else
+        state.further += {key, value};
+    return true;
+}
+
+Failure damagedState(const QString& why) {
+    return {Failure::Kind::Damaged, QStringLiteral("the order's state %1").arg(why)};
+}
+
+} // namespace
+
+QByteArray OrderState::write() const {
+    StateWriter writer;
+    writer.word("Phase", phases, phase);
+    writer.text(QStringLiteral("MisparHazmana"), number);
+    writer.text(QStringLiteral("Shemot.ser"), serial);
+    writer.text(QStringLiteral("Optint"), QString::number(static_cast<int>(kind)));
+    writer.word("Way", ways, way);
+    writer.truth("FolderMadeByUs", folderMadeByUs);
+    writer.truth("ProvenByNameOnly", provenByNameOnly);
+    writer.word("Report", reports, report);
+    for (const QString& path : filesInHand)
+        writer.text(QStringLiteral("InHand"), path);
+    if (phase == Phase::Preparing) {
+        for (const auto& [key, value] : choices)
+            writer.text(choicePrefix + key, value);
+        for (const QString& item : items)
+            writer.text(QStringLiteral("Shoora"), item);
+    }
+    for (const auto& [key, value] : further)
+        writer.text(key, value);
+    return writer.end();
+}
+
+Result<OrderState> OrderState::parse(const QByteArray& bytes) {
+    QList<ListOutputEntry> entries = ReadListOutput(bytes);
+    const bool whole = bytes.endsWith("\r\n") && !entries.isEmpty() && entries.last().key == lastKey &&
+                       entries.last().value == QString::number(entries.size() - 1);
+    if (!whole)
+        return damagedState(QStringLiteral("is not whole"));
+    entries.removeLast();
+    OrderState state;
+    bool phaseTold = false;
+    for (const auto& [writtenKey, writtenValue] : std::as_const(entries)) {
+        const QString key = withBreaks(writtenKey);
+        const QString value = withBreaks(writtenValue);
+        phaseTold = phaseTold || key == u"Phase";
+        if (!takeEntry(state, key, value))
+            return damagedState(QStringLiteral("has \"%1\" for %2").arg(value, key));
+    }
+    if (!phaseTold)
+        return damagedState(QStringLiteral("has no phase"));
+    return state;
+}
+
+Result<void> WriteOrderState(const Files& files, const OrderFolder& folder, const OrderState& state) {
+    return files.writeWhole(statePath(folder), state.write());
+}
+
+Result<OrderState> ReadOrderState(const Files& files, const OrderFolder& folder) {
+    const QString path = statePath(folder);
+    const Result<QByteArray> bytes = files.read(path);
+    if (!bytes)
+        return bytes.failure();
+    Result<OrderState> state = OrderState::parse(*bytes);
+    if (!state)
+        return Failure{state.failure().kind, QStringLiteral("%1: %2").arg(path, state.failure().message)};
+    return state;
+}
+
+} // namespace lumora

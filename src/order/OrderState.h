@@ -1,0 +1,54 @@
+#pragma once
+
+#include "common/ListOutput.h"
+#include "common/Result.h"
+#include "session/SessionState.h"
+
+#include <QByteArray>
+#include <QStringList>
+
+namespace lumora {
+
+class Files;
+class OrderFolder;
+
+// How far an order has come, kept in the hidden file .order of its folder, so that it can go on behind the end of the
+// program. It never travels. docs/formats.md has the table.
+struct OrderState {
+    enum class Phase {
+        Preparing, // prints are being made; the basket and the choices are kept with it
+        Prepared,  // whole on the disk, nothing of it sent
+        Sending,   // a part may lie on the server
+        Arrived,   // proven to lie on the server
+        Reported,  // arrived, and the lab was told or needs no telling
+    };
+    // By what the order leaves. A local station keeps it; one that went by mail is not known to the servers.
+    enum class Way { Ftp, Http, Station, Mail };
+    // Report and done call. Begun is stored before the request goes out: whoever finds it can't know whether the lab
+    // has heard.
+    enum class Report { NotYet, Begun, Done };
+
+    Phase phase = Phase::Preparing;
+    QString number; // MisparHazmana
+    QString serial; // Shemot.ser
+    OrderKind kind = OrderKind::NotChosen;
+    Way way = Way::Ftp;
+    bool folderMadeByUs = false;   // this order made its folder on the server
+    bool provenByNameOnly = false; // the server told no lengths
+    QStringList filesInHand;       // full paths whose put has begun and was not confirmed
+    Report report = Report::NotYet;
+    QStringList items;              // lines of the basket; written while preparing only, like the choices
+    QList<ListOutputEntry> choices; // as OrderChoices has them
+    QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
+
+    QByteArray write() const;
+    // Damaged: not whole, or with a word that this version does not know.
+    static Result<OrderState> parse(const QByteArray& bytes);
+};
+
+// Whole and synced: a crash leaves the old state or the new one.
+Result<void> WriteOrderState(const Files& files, const OrderFolder& folder, const OrderState& state);
+// NotFound for an order without a state, which was made by an older version or by hand.
+Result<OrderState> ReadOrderState(const Files& files, const OrderFolder& folder);
+
+} // namespace lumora

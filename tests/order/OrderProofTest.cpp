@@ -1,0 +1,270 @@
+#include "order/ArrivalProof.h"
+#include "order/LineEnds.h"
+#include "order/OrderCompleteness.h"
+#include "order/OrderFolder.h"
+#include "order/OrderLog.h"
+#include "order/PrintFileName.h"
+#include "support/ExampleOrder.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+using Names = ArrivalProof::Names;
+
+TEST(AnArrival, isProvenByEachNameAndEachLength) {
+    struct Case {
+        const char* what;
+        QList<LocalFile> here;
+        QList<RemoteFile> there;
+        Names names;
+        const char* found; // missing | broken | by length | by name | common
+        bool proven;
+        bool byNameOnly;
+    };
+    const std::optional<qint64> none;
+    const QList<LocalFile> two = {{u"a.txt"_s, 10}, {u"B.jpp"_s, 900}};
+    const Case cases[] = {
+        {"whole", two, {{u"B.jpp"_s, 900}, {u"a.txt"_s, 10}}, Names::Exact, "||a.txt,B.jpp||", true, false},
+        {"another customer's names beside",
+         two,
+         {{u"a.txt"_s, 10}, {u"x"_s, 1}, {u"B.jpp"_s, 900}, {u".."_s, none}},
+         Names::Exact,
+         "||a.txt,B.jpp||",
+         true,
+         false},
+        {"count equal, a name missing",
+         two,
+         {{u"a.txt"_s, 10}, {u"b.jpp"_s, 900}},
+         Names::Exact,
+         "B.jpp||a.txt||",
+         false,
+         false},
+        {"letter case of a web server",
+         two,
+         {{u"A.TXT"_s, 10}, {u"b.jpp"_s, none}},
+         Names::WithoutCase,
+         "||a.txt|B.jpp|",
+         true,
+         true},
+        {"a part of a name",
+         two,
+         {{u"a"_s, none}, {u"."_s, none}, {u"B.jpp.part"_s, 900}},
+         Names::WithoutCase,
+         "a.txt,B.jpp||||",
+         false,
+         false},
+        {"cut short and emptied",
+         two,
+         {{u"a.txt"_s, 0}, {u"B.jpp"_s, 899}},
+         Names::Exact,
+         "|a.txt,B.jpp|||",
+         false,
+         false},
+        {"longer", two, {{u"a.txt"_s, 11}, {u"B.jpp"_s, 900}}, Names::Exact, "|a.txt|B.jpp||", false, false},
+        {"no length told", two, {{u"a.txt"_s, none}, {u"B.jpp"_s, none}}, Names::Exact, "|||a.txt,B.jpp|", true, true},
+        {"the proof picture of another order",
+         {{u"000.jpg"_s, 5}},
+         {{u"000.jpg"_s, 7}},
+         Names::Exact,
+         "||||000.jpg",
+         true,
+         false},
+        {"no proof picture", {{u"000.jpg"_s, 5}}, {}, Names::Exact, "000.jpg||||", false, false},
+        {"both letter cases there, ours is cut",
+         {{u"a.jpp"_s, 9}},
+         {{u"A.jpp"_s, 9}, {u"a.jpp"_s, 4}},
+         Names::WithoutCase,
+         "|a.jpp|||",
+         false,
+         false},
+        {"a name told twice, once with its length",
+         {{u"a.jpp"_s, 9}},
+         {{u"a.jpp"_s, none}, {u"a.jpp"_s, 8}},
+         Names::Exact,
+         "|a.jpp|||",
+         false,
+         false},
+        {"a file of the order twice", {{u"a"_s, 1}, {u"a"_s, 1}}, {{u"a"_s, 1}}, Names::Exact, "||a||", true, false},
+        {"an empty file and an empty server", {{u"a"_s, 0}}, {}, Names::Exact, "a||||", false, false},
+        {"an empty file that arrived", {{u"a"_s, 0}}, {{u"a"_s, 0}}, Names::Exact, "||a||", true, false},
+    };
+    for (const Case& c : cases) {
+        SCOPED_TRACE(c.what);
+        const ArrivalProof proof = ArrivalProof::of(c.here, c.there, c.names);
+        QStringList found;
+        for (const QStringList& list : {proof.missing, proof.broken, proof.byLength, proof.byName, proof.commonName})
+            found += list.join(u',');
+        EXPECT_EQ(found.join(u'|').toStdString(), c.found);
+        EXPECT_EQ(proof.proven(), c.proven);
+        EXPECT_EQ(proof.provenByNameOnly(), c.byNameOnly);
+    }
+}
+
+TEST(LineEnds, tellAServerThatChangesFilesFromOneThatCutsThem) {
+    // 4 pairs, a CR alone, 3 LF alone.
+    const QByteArray bytes = QByteArray(88, 'x') + "\r\n\r\n\r\n\r\r\n\n\n\n";
+    LineEnds ends;
+    ends.add(QByteArrayView(bytes).first(93)); // a pair that is cut by the parts that are read
+    ends.add(QByteArrayView(bytes).sliced(93));
+    EXPECT_EQ(ends.cr, 5);
+    EXPECT_EQ(ends.crlf, 4);
+    EXPECT_EQ(ends.lf, 7);
+    const struct {
+        qint64 there;
+        bool changed;
+    } cases[] = {{100, false}, {95, true},  {96, true},  {97, false},  {99, false},
+                 {0, false},   {107, true}, {103, true}, {101, false}, {90, false}};
+    for (const auto& [there, changed] : cases)
+        EXPECT_EQ(ends.explain(100, there), changed) << there;
+    LineEnds without;
+    without.add("no end at all");
+    EXPECT_FALSE(without.explain(13, 12));
+    EXPECT_FALSE(without.explain(13, 13));
+
+    TestPlatform test;
+    const QByteArray large = QByteArray(65535, 'x') + "\r\n\r";
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\large"_s, large));
+    const Result<LineEnds> read = LineEndsOf(test.files, u"C:\\large"_s);
+    ASSERT_TRUE(read);
+    EXPECT_TRUE(read->cr == 2 && read->lf == 1 && read->crlf == 1);
+    EXPECT_FALSE(LineEndsOf(test.files, u"C:\\none"_s));
+}
+
+// An order of so many pictures, of which some failed and one has a name that no print file can have.
+OrderLog logOf(OrderLog::Layout layout, int pictures, int failed) {
+    OrderLog log;
+    log.layout = layout;
+    log.Hazmana = u"2026_11_21_KUP_1234^105"_s;
+    const QString code = u"1 1015GNB"_s + (layout == OrderLog::Layout::Edited ? QString(200, u' ') : QString());
+    for (int i = 0; i < pictures; ++i) {
+        log.items += code + u"C:\\p\\pic%1.jpg"_s.arg(i);
+        if (i < failed)
+            log.failed += u"C:\\p\\pic%1.jpg"_s.arg(i);
+    }
+    log.items += code + u"C:\\p\\.jpg"_s;
+    return log;
+}
+
+QString printName(int index) {
+    return PrintFileName{u"1 1015GNB"_s, index, 1, u"pic%1"_s.arg(index)}.text();
+}
+
+QString piece(int index, const char* tail) {
+    return printName(index).chopped(4) + u"_jpp_"_s + QString::fromLatin1(tail) + u".prk"_s;
+}
+
+TEST(AnOrder, isWholeWhenEveryPrintOfItsLogIsThereAndMarked) {
+    using Verdict = OrderCompleteness::Verdict;
+    using Layout = OrderLog::Layout;
+    const QStringList three = {printName(0), printName(1), printName(2)};
+    const QStringList besides = {u"!105_1234.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s, u"000.jpg"_s, u"kashloo.txt"_s};
+    struct Case {
+        const char* what;
+        int failed;
+        QStringList present;
+        QStringList marked;
+        Verdict verdict;
+    };
+    const Case cases[] = {
+        {"whole", 0, three + besides, three + besides, Verdict::Whole},
+        {"a failed picture has no print", 1, three.mid(1) + besides, three.mid(1), Verdict::Whole},
+        {"all failed", 3, besides, besides, Verdict::None},
+        {"sheet and text alone are marked", 0, three + besides, besides, Verdict::None},
+        {"the choice was cancelled", 0, three, {}, Verdict::None},
+        {"the prints were cleaned away", 0, besides, three, Verdict::None},
+        {"one is not marked", 0, three, three.mid(1), Verdict::Fewer},
+        {"one is lost", 0, three.mid(1), three, Verdict::Fewer},
+        {"pieces in place of a print",
+         0,
+         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
+         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
+         Verdict::Whole},
+        {"a piece is not marked",
+         0,
+         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
+         {printName(0), printName(1), piece(2, "001_003"), piece(2, "003_003")},
+         Verdict::Fewer},
+    };
+    for (const Layout layout : {Layout::Plain, Layout::Edited, Layout::Album}) {
+        for (const Case& c : cases) {
+            OrderLog log; // as a reader finds it
+            log.read(logOf(layout, 3, c.failed).write());
+            const OrderCompleteness counts = OrderCompleteness::of(&log, c.present, c.marked);
+            EXPECT_EQ(counts.named, 3 - c.failed) << c.what;
+            EXPECT_EQ(counts.verdict(), c.verdict) << c.what << ": " << counts.present << " " << counts.marked;
+        }
+    }
+    EXPECT_EQ(OrderCompleteness::of(nullptr, three, three).verdict(), Verdict::Unknown);
+    EXPECT_EQ(OrderCompleteness::of(nullptr, three, besides).verdict(), Verdict::None);
+}
+
+TEST(AFamilyOfPieces, isWholeWithoutAGapAndWithAllThatItsNameDeclaresLessOne) {
+    const struct {
+        QList<const char*> tails;
+        bool whole;
+    } cases[] = {
+        {{"001_001"}, true},
+        {{"001_002"}, true}, // an exact multiple
+        {{"001_003", "002_003"}, true},
+        {{"002_002"}, false},
+        {{"001_003", "003_003"}, false},
+        {{"001_004", "002_004"}, false},
+        {{"001_003", "002_004"}, false}, // of two families
+        {{"000_001"}, false},
+        {{"00x_001"}, false},
+    };
+    for (const auto& [tails, whole] : cases) {
+        QStringList names;
+        for (const char* tail : tails)
+            names += piece(0, tail);
+        EXPECT_EQ(PrintsAmong(names), whole ? QStringList(printName(0)) : QStringList())
+            << names.join(u' ').toStdString();
+    }
+    EXPECT_EQ(PrintsAmong({printName(0), piece(0, "001_001"), printName(0)}).size(), 1) << "one print in two forms";
+    EXPECT_TRUE(PrintsAmong({u"!105_1234_jpp_001_001.prk"_s, u"_001_001.prk"_s, u".prk"_s}).isEmpty());
+}
+
+TEST(AnOrder, isReadFromItsFolder) {
+    TestPlatform test;
+    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_s);
+    ASSERT_TRUE(test.files.makeFolder(folder.path()));
+    ASSERT_TRUE(test.files.writeWhole(folder.filePath(printName(0)), "x"));
+    EXPECT_EQ(OrderCompleteness::read(test.files, folder, {printName(0)}).named, std::nullopt);
+    ASSERT_TRUE(test.files.writeWhole(folder.logPath(), "rubbish"));
+    EXPECT_EQ(OrderCompleteness::read(test.files, folder, {printName(0)}).named, std::nullopt);
+    ASSERT_TRUE(test.files.writeWhole(folder.logPath(), logOf(OrderLog::Layout::Album, 2, 0).write()));
+    const OrderCompleteness counts = OrderCompleteness::read(test.files, folder, {printName(0)});
+    EXPECT_TRUE(counts.named == 2 && counts.present == 1 && counts.marked == 1);
+}
+
+TEST(AnOrderNumber, belongsToTheFirstThatMakesItsFolder) {
+    TestPlatform test;
+    SessionState one = exampleOrder();
+    one.DiskRoot = u"C:\\"_s;
+    SessionState two = one;
+    const Result<OrderFolder> first = claimOrderFolder(one, test.files, OrderFolder::Ending::Plain);
+    const Result<OrderFolder> second = claimOrderFolder(two, test.files, OrderFolder::Ending::BySession);
+    ASSERT_TRUE(first && second);
+    EXPECT_EQ(one.MisparHazmana + two.MisparHazmana, u"105106"_s);
+    EXPECT_NE(first->path(), second->path());
+
+    // An unfinished order of yesterday, in pieces, has the next number; a finished one of yesterday has none to keep.
+    const QString orders = u"C:\\2000lumora\\!!000\\"_s;
+    ASSERT_TRUE(test.files.makeFolder(orders + u"2026_11_20_KUP_1234^107P"_s));
+    const OrderFolder finished(orders + u"2026_11_20_KUP_1234^108"_s);
+    ASSERT_TRUE(test.files.makeFolder(finished.path()));
+    ASSERT_TRUE(test.files.writeWhole(finished.logPath(), "x"));
+    ASSERT_TRUE(claimOrderFolder(one, test.files, OrderFolder::Ending::Plain));
+    EXPECT_EQ(one.MisparHazmana, u"108"_s);
+
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\blocked"_s, "x"));
+    one.DiskRoot = u"C:\\blocked\\"_s;
+    EXPECT_FALSE(claimOrderFolder(one, test.files, OrderFolder::Ending::Plain));
+    EXPECT_EQ(one.MisparHazmana, u"108"_s);
+}
+
+} // namespace
+} // namespace lumora
