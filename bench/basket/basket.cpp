@@ -28,7 +28,7 @@ FolderPager foundPictures() {
 
 QString line(int copies, const QString& path, LineForm form) {
     return BasketLine{PrintCode{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}.compose(),
-                      EditRecord::newPicture(), path}
+                      EditRecord::newPicture(), DrivePath(path)}
         .compose(form);
 }
 
@@ -84,7 +84,7 @@ void PlusOnTheLastPicture(benchmark::State& state) {
 void MinusAndChoiceOfTheFirstPicture(benchmark::State& state) {
     Basket basket = fullBasket(formOf(state));
     for (auto _ : state) {
-        const QString first = BasketLine::split(basket.item(0), basket.form()).path;
+        const QString first = BasketLine::split(basket.item(0), basket.form()).path.text();
         basket.removeAt(basket.FindByPath(first));
         if (basket.FindByPath(first) < 0)
             basket.append(line(1, first, basket.form()));

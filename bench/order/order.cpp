@@ -124,7 +124,7 @@ public:
         m_state.MisparHazmana = QString::number(++m_number);
         for (int i = 0; i < pictures; ++i)
             m_state.handOver.lines +=
-                QStringLiteral("1 1015GNB") + (m_kind == Kind::Edited ? recordOf(i) : QString()) + drivePath(i);
+                QStringLiteral("1 1015GNB") + (m_kind == Kind::Edited ? recordOf(i) : QString()) + drivePath(i).text();
         const PageId id = m_kind == Kind::Plain ? PageId::Form2 : PageId::B3;
         m_chain.show(id);
         auto* page = dynamic_cast<PreparationPage*>(m_chain.find(id));
@@ -159,10 +159,10 @@ public:
 
 private:
     const HostPath& source(int i) const { return m_pictures[static_cast<std::size_t>(i) % m_pictures.size()]; }
-    QString drivePath(int i) const { return m_machine.drives.toDrive(source(i)); }
+    DrivePath drivePath(int i) const { return m_machine.drives.toDrive(source(i)); }
 
     HostPath makeFolder(const char* path) {
-        const HostPath folder = *m_machine.drives.toHost(QString::fromLatin1(path));
+        const HostPath folder = *m_machine.drives.toHost(DrivePath(QString::fromLatin1(path)));
         std::filesystem::create_directories(folder);
         return folder;
     }
@@ -196,7 +196,7 @@ private:
         EditedPrint print;
         print.file = edit.RedMarker == EditRecord::corrected ? corrected(i) : source(i);
         print.paper = {10, 15};
-        print.framesFolder = *m_machine.drives.toHost(QStringLiteral("C:\\2000lumora\\misgarot"));
+        print.framesFolder = *m_machine.drives.toHost(DrivePath(QStringLiteral("C:\\2000lumora\\misgarot")));
         return renderEditedPrintToJpeg(print, edit);
     }
 

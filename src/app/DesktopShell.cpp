@@ -13,9 +13,9 @@ void DesktopShell::openWebPage(const QString& url) {
     QDesktopServices::openUrl(QUrl(url, QUrl::TolerantMode));
 }
 
-void DesktopShell::openFolder(const QString& drivePath) {
-    if (const auto folder = m_drives.toHost(drivePath))
-        QDesktopServices::openUrl(QUrl::fromLocalFile(toText(*folder)));
+void DesktopShell::openFolder(const DrivePath& folder) {
+    if (const auto host = m_drives.toHost(folder))
+        QDesktopServices::openUrl(QUrl::fromLocalFile(toText(*host)));
 }
 
 void DesktopShell::copyToClipboard(const QString& text) {

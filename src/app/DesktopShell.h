@@ -13,7 +13,7 @@ public:
         : m_drives(drives) {}
 
     void openWebPage(const QString& url) override;
-    void openFolder(const QString& drivePath) override;
+    void openFolder(const DrivePath& folder) override;
     void copyToClipboard(const QString& text) override;
 
 private:

@@ -56,8 +56,8 @@ double PreparationPage::share() const {
     return m_count > 0 ? static_cast<double>(m_position) / m_count : 0;
 }
 
-void PreparationPage::addFailed(const QString& path) {
-    shared().List4fail.append(path);
+void PreparationPage::addFailed(const DrivePath& path) {
+    shared().List4fail.append(path.text());
     showProgress();
     Q_EMIT changed();
 }
@@ -144,7 +144,7 @@ void PreparationPage::handOver(Outcome prepared) {
     if (!goesOn)
         tell(QStringLiteral("ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."),
              QStringLiteral("The order is ready, but this version has no page to go on with it."),
-             m_state.transfer.OrderFolder);
+             m_state.transfer.OrderFolder.text());
     if (!goesOn || prepared == Outcome::KeptAtStation)
         m_state.handOver.notice =
             m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")

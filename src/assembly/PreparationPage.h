@@ -71,7 +71,7 @@ protected:
     void setStage(Stage stage, int position = 0);
     // All sentences about progress, in the language of the session.
     virtual void showProgress();
-    void addFailed(const QString& path);
+    void addFailed(const DrivePath& path);
 
     // Claims a number that is free by making its folder, which the senders are told too. A second start of this page
     // keeps number and folder, less the print files of the first. No value, with words, when the folder can't be made.

@@ -31,7 +31,7 @@ public:
     struct Line {
         int index; // in the basket, from 0
         QString code;
-        QString path;
+        DrivePath path;
     };
     struct Outcome {
         bool packed = false;
@@ -45,7 +45,7 @@ public:
 
     // Takes the scratch picture away.
     void removeScratch() const;
-    const QString& scratch() const { return m_scratch; }
+    const DrivePath& scratch() const { return m_scratch; }
 
     // What a manifest would tell of the step in work: length, code, running number, name.
     const QString& manifestLine() const { return m_manifestLine; }
@@ -56,7 +56,7 @@ private:
     const OrderFolder m_folder;
     const OrderTail m_tail;
     const PrintFileShape m_shape;
-    const QString m_scratch;
+    const DrivePath m_scratch;
     const int m_tailForm;
     Result<void> m_folderThere;
     QString m_manifestLine;

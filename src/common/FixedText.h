@@ -6,6 +6,9 @@
 
 namespace lumora {
 
+// The text of a field that was not chosen yet, and of a part that a path does not have.
+inline const QString notChosen = QStringLiteral("***");
+
 // Left-justified in a field of width characters, blank-filled, cut when too long.
 QString LeftField(const QString& text, int width);
 

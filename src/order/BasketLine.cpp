@@ -1,6 +1,5 @@
 #include "order/BasketLine.h"
 
-#include "common/DrivePathText.h"
 #include "order/EditRecord.h"
 
 namespace lumora {
@@ -10,16 +9,17 @@ int BasketLine::pathColumn(LineForm form) {
 }
 
 QString BasketLine::compose(LineForm form) const {
-    return form == LineForm::Full ? code + LeftField(editState, EditRecord::width) + path : code + path;
+    return form == LineForm::Full ? code + LeftField(editState, EditRecord::width) + path.text() : code + path.text();
 }
 
 BasketLine BasketLine::split(const QString& line, LineForm form) {
     const int column = pathColumn(form);
-    return {line.left(PrintCode::width), line.mid(PrintCode::width, column - PrintCode::width), line.mid(column)};
+    return {line.left(PrintCode::width), line.mid(PrintCode::width, column - PrintCode::width),
+            DrivePath(line.mid(column))};
 }
 
 bool BasketLine::hasUsableName() const {
-    return LeafName(path).size() >= 5;
+    return path.leaf().size() >= 5;
 }
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "order/PrintCode.h"
 #include "session/SessionState.h"
 
@@ -18,7 +19,7 @@ constexpr LineForm lineFormOf(OrderKind kind) {
 struct BasketLine {
     QString code;      // PrintCode composes it; split() takes it unchecked
     QString editState; // the edit record; full form only
-    QString path;
+    DrivePath path;
 
     // Number of characters before the path.
     static int pathColumn(LineForm form);

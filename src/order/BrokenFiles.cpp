@@ -1,7 +1,7 @@
 #include "order/BrokenFiles.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "order/OrderFolder.h"
 #include "platform/files/Files.h"
 #include "session/TextList.h"
@@ -18,7 +18,7 @@ Result<void> WriteBrokenFiles(const Files& files, const OrderFolder& folder, con
 }
 
 QStringList ReadBrokenFiles(const Files& files, const OrderFolder& folder) {
-    const QString path = folder.brokenFilesPath();
+    const DrivePath path = folder.brokenFilesPath();
     if (!files.fileExists(path))
         return {};
     const auto bytes = files.read(path);

@@ -22,17 +22,18 @@ bool LineEnds::explain(qint64 here, qint64 there) const {
     return longer == -cr || longer == -crlf || longer == lf || longer == bareLf;
 }
 
-Result<LineEnds> LineEndsOf(const Files& files, const QString& path) {
+Result<LineEnds> LineEndsOf(const Files& files, const DrivePath& path) {
     const Result<HostPath> host = files.host(path);
     if (!host)
         return host.failure();
-    const Result<Descriptor> source = openSource(*host, path);
+    const Result<Descriptor> source = openSource(*host, path.text());
     if (!source)
         return source.failure();
     LineEnds ends;
     QByteArray part(qsizetype(1) << 16, Qt::Uninitialized);
     for (;;) {
-        const Result<std::size_t> count = readSome(*source, part.data(), static_cast<std::size_t>(part.size()), path);
+        const Result<std::size_t> count =
+            readSome(*source, part.data(), static_cast<std::size_t>(part.size()), path.text());
         if (!count)
             return count.failure();
         if (*count == 0)

@@ -3,10 +3,10 @@
 #include "common/Result.h"
 
 #include <QByteArrayView>
-#include <QString>
 
 namespace lumora {
 
+class DrivePath;
 class Files;
 
 // The line ends among the bytes of a file, by which a server is known that converts what it takes for text: it drops
@@ -27,6 +27,6 @@ private:
 };
 
 // Counts those of a file, read in parts.
-Result<LineEnds> LineEndsOf(const Files& files, const QString& path);
+Result<LineEnds> LineEndsOf(const Files& files, const DrivePath& path);
 
 } // namespace lumora

@@ -169,11 +169,11 @@ private:
     void checkEveryItemIsThere() {
         for (qsizetype i = 0; i < m_log.items.size(); ++i) {
             const BasketLine item = m_log.line(i);
-            const bool excused = !item.hasUsableName() || m_log.failed.contains(item.path);
+            const bool excused = !item.hasUsableName() || m_log.failed.contains(item.path.text());
             if (!m_made.contains(static_cast<int>(i)) && !excused)
                 fault(QStringLiteral("line %1 of the basket (%2) has no print file and is not named as failed")
                           .arg(i)
-                          .arg(item.path));
+                          .arg(item.path.text()));
         }
     }
 

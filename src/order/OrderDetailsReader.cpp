@@ -19,8 +19,8 @@ void setAll(OrderDetails& details, const QString& text) {
 }
 
 // Reads the log and copies the customer's fields into details, except from an album's log, which lacks them.
-std::optional<OrderLog> readLog(const Files& files, const QString& path, OrderDetails& details) {
-    const auto bytes = files.fileExists(path) ? files.read(path) : Failure{Failure::Kind::NotFound, path};
+std::optional<OrderLog> readLog(const Files& files, const DrivePath& path, OrderDetails& details) {
+    const auto bytes = files.fileExists(path) ? files.read(path) : Failure{Failure::Kind::NotFound, path.text()};
     if (!bytes) {
         setAll(details, QStringLiteral("NO details"));
         return std::nullopt;
@@ -38,11 +38,11 @@ std::optional<OrderLog> readLog(const Files& files, const QString& path, OrderDe
 
 } // namespace
 
-void ReadOrderDetails(const Files& files, const QString& path, OrderDetails& details) {
+void ReadOrderDetails(const Files& files, const DrivePath& path, OrderDetails& details) {
     readLog(files, path, details);
 }
 
-void ReadResentDetails(const Files& files, const QString& path, OrderDetails& details) {
+void ReadResentDetails(const Files& files, const DrivePath& path, OrderDetails& details) {
     setAll(details, {});
     const auto log = readLog(files, path, details);
     if (!log || log->layout != OrderLog::Layout::Album)

@@ -1,6 +1,5 @@
 #include "order/OrderFolder.h"
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "order/OrderNames.h"
 #include "platform/files/Files.h"
@@ -10,18 +9,18 @@
 namespace lumora {
 namespace {
 
-QString pathOf(const SessionState& state, const QString& number, OrderFolder::Ending ending) {
+DrivePath pathOf(const SessionState& state, const QString& number, OrderFolder::Ending ending) {
     const bool marked = ending == OrderFolder::Ending::BySession && state.transfer.HazmanaP > 0;
     const QString name = OrderName(state.shemot.TimeOfJob, number);
-    return JoinDrivePath(WorkspacePaths::orders(state), marked ? name + u'P' : name);
+    return WorkspacePaths::orders(state) / (marked ? name + u'P' : name);
 }
 
 // The numbers of the orders without a log, each also without the "P" of its folder.
 QStringList numbersOfUnfinished(const SessionState& state, const Files& files) {
-    const QString orders = WorkspacePaths::orders(state);
+    const DrivePath orders = WorkspacePaths::orders(state);
     QStringList numbers;
     for (const QString& name : files.folders(orders)) {
-        if (files.fileExists(OrderFolder(JoinDrivePath(orders, name)).logPath()))
+        if (files.fileExists(OrderFolder(orders / name).logPath()))
             continue;
         const QString number = OrderNumberOf(name);
         numbers += TravelsInPieces(number) ? number.chopped(1) : number;
@@ -40,20 +39,20 @@ OrderFolder OrderFolder::inPreparation(const SessionState& state, Ending ending)
 }
 
 bool OrderFolder::isChosen() const {
-    return !m_path.isEmpty() && m_path != notChosen;
+    return !m_path.isEmpty() && m_path.text() != notChosen;
 }
 
 QString OrderFolder::name() const {
-    return LeafName(m_path);
+    return m_path.leaf();
 }
 
-QString OrderFolder::filePath(const QString& fileName) const {
-    return JoinDrivePath(m_path, fileName);
+DrivePath OrderFolder::filePath(const QString& fileName) const {
+    return m_path / fileName;
 }
 
 Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, OrderFolder::Ending ending) {
-    const QString orders = WorkspacePaths::orders(state);
-    for (const QString& path : {ParentFolder(orders), orders}) {
+    const DrivePath orders = WorkspacePaths::orders(state);
+    for (const DrivePath& path : {orders.parent(), orders}) {
         if (const Result<void> made = files.makeFolder(path); !made)
             return made.failure();
     }
@@ -73,8 +72,8 @@ Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, Or
 }
 
 Result<void> makeOrderFolder(const Files& files, const OrderFolder& folder) {
-    const QString orders = ParentFolder(folder.path());
-    for (const QString& path : {ParentFolder(orders), orders, folder.path()}) {
+    const DrivePath orders = folder.path().parent();
+    for (const DrivePath& path : {orders.parent(), orders, folder.path()}) {
         if (files.folderExists(path))
             continue;
         if (Result<void> made = files.makeFolder(path); !made)

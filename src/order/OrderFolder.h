@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QString>
@@ -15,7 +16,7 @@ struct SessionState;
 class OrderFolder {
 public:
     // path is empty or "***" when no order is chosen.
-    explicit OrderFolder(QString path)
+    explicit OrderFolder(DrivePath path)
         : m_path(std::move(path)) {}
 
     // The order that is being sent or looked at (OrderFolder of the session).
@@ -27,16 +28,16 @@ public:
     static OrderFolder inPreparation(const SessionState& state, Ending ending);
 
     bool isChosen() const;
-    const QString& path() const { return m_path; }
+    const DrivePath& path() const { return m_path; }
     QString name() const; // also the folder's name on the server
-    QString filePath(const QString& fileName) const;
-    QString logPath() const { return filePath(name() + QStringLiteral(".txt")); }
+    DrivePath filePath(const QString& fileName) const;
+    DrivePath logPath() const { return filePath(name() + QStringLiteral(".txt")); }
     // The log's path without its ending, by which the senders refer to the order.
-    QString logBase() const { return filePath(name()); }
-    QString brokenFilesPath() const { return filePath(QStringLiteral("kashloo.txt")); }
+    DrivePath logBase() const { return filePath(name()); }
+    DrivePath brokenFilesPath() const { return filePath(QStringLiteral("kashloo.txt")); }
 
 private:
-    QString m_path;
+    DrivePath m_path;
 };
 
 // Makes the folder of a new order under the first number, from that of the session on, that no other order has, and

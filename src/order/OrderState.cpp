@@ -18,7 +18,7 @@ constexpr std::array reports = {"not yet", "begun", "done"};
 const QString choicePrefix = QStringLiteral("Choice.");
 const QString lastKey = QStringLiteral("End");
 
-QString statePath(const OrderFolder& folder) {
+DrivePath statePath(const OrderFolder& folder) {
     return folder.filePath(QStringLiteral(".order"));
 }
 
@@ -160,13 +160,13 @@ Result<void> WriteOrderState(const Files& files, const OrderFolder& folder, cons
 }
 
 Result<OrderState> ReadOrderState(const Files& files, const OrderFolder& folder) {
-    const QString path = statePath(folder);
+    const DrivePath path = statePath(folder);
     const Result<QByteArray> bytes = files.read(path);
     if (!bytes)
         return bytes.failure();
     Result<OrderState> state = OrderState::parse(*bytes);
     if (!state)
-        return Failure{state.failure().kind, QStringLiteral("%1: %2").arg(path, state.failure().message)};
+        return Failure{state.failure().kind, QStringLiteral("%1: %2").arg(path.text(), state.failure().message)};
     return state;
 }
 

@@ -1,7 +1,6 @@
 #include "order/PrintFileName.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "order/PrintCode.h"
 
@@ -28,8 +27,8 @@ int PrintFileName::copies() const {
     return PrintCode::copiesOf(code);
 }
 
-QString PrintBaseName(const QString& path) {
-    return RightPart(NameWithoutEnding(path), 20);
+QString PrintBaseName(const DrivePath& path) {
+    return RightPart(path.stem(), 20);
 }
 
 } // namespace lumora

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "common/DrivePath.h"
+
 #include <QString>
 
 #include <optional>
@@ -24,6 +26,6 @@ struct PrintFileName {
 };
 
 // The base name in names and tails: the last 20 characters of the file name without its last four.
-QString PrintBaseName(const QString& path);
+QString PrintBaseName(const DrivePath& path);
 
 } // namespace lumora

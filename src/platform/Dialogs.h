@@ -1,5 +1,7 @@
 #pragma once
 
+#include "common/DrivePath.h"
+
 #include <QString>
 
 namespace lumora {
@@ -19,8 +21,8 @@ public:
     // code page is "?". prompt stands above the list. With EveryFile the list opens at initialFolder, with Pictures at
     // the media that customers bring.
     enum class Offer { Pictures, EveryFile };
-    virtual QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
-                             Offer offer = Offer::Pictures) = 0;
+    virtual DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
+                               Offer offer = Offer::Pictures) = 0;
 };
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QDateTime>
@@ -30,7 +31,7 @@ public:
     virtual ~Shell() = default;
     // Errors are ignored: with no browser or file manager nothing happens.
     virtual void openWebPage(const QString& url) = 0;
-    virtual void openFolder(const QString& drivePath) = 0;
+    virtual void openFolder(const DrivePath& folder) = 0;
     virtual void copyToClipboard(const QString& text) = 0;
 };
 
@@ -38,7 +39,7 @@ class Volume {
 public:
     virtual ~Volume() = default;
     // A stable signed 32-bit number of the file system on which a drive's root folder lies.
-    virtual Result<std::int32_t> serial(const QString& driveRoot) const = 0;
+    virtual Result<std::int32_t> serial(const DrivePath& driveRoot) const = 0;
 };
 
 } // namespace lumora

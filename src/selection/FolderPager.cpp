@@ -1,7 +1,5 @@
 #include "selection/FolderPager.h"
 
-#include "common/DrivePathText.h"
-
 #include <algorithm>
 
 namespace lumora {
@@ -23,13 +21,13 @@ void FolderPager::clear() {
     m_known.clear();
 }
 
-int FolderPager::addFolder(const QString& folder, const QStringList& names) {
+int FolderPager::addFolder(const DrivePath& folder, const QStringList& names) {
     const int lastBefore = m_paths.lastIndex();
     for (const QString& name : names) {
         // Only a root ends in a backslash: "1.jpg" of the folder "a" is not the file "a1.jpg".
-        if (folder.endsWith(u'\\') && IsInFolderList(folder + name))
+        if (folder.text().endsWith(u'\\') && IsInFolderList(folder.text() + name))
             continue;
-        const QString path = JoinDrivePath(folder, name);
+        const QString path = (folder / name).text();
         m_paths.append(path);
         m_known.insert(path);
     }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "session/TextList.h"
 
 #include <QSet>
@@ -30,7 +31,7 @@ public:
     // Adds the files of a folder and returns how many it added. A drive root that is picked twice stands once in the
     // list, any other folder twice: a file is left out when folder and name, joined without a separator, are in the
     // list. When the list grew, the reading position becomes the last of the old items, or the first picture.
-    int addFolder(const QString& folder, const QStringList& names);
+    int addFolder(const DrivePath& folder, const QStringList& names);
 
     bool IsInFolderList(const QString& path) const { return m_known.contains(path); }
 

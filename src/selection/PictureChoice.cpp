@@ -20,7 +20,7 @@ PrintCode PictureChoice::code(int copies, PaperWords words) {
 
 void PictureChoice::put(const BasketLine& line) {
     const QString text = line.compose(m_basket.form());
-    if (const int index = m_basket.FindByPath(line.path); index >= 0)
+    if (const int index = m_basket.FindByPath(line.path.text()); index >= 0)
         m_basket.replaceAt(index, text);
     else
         m_basket.append(text);
@@ -69,7 +69,7 @@ void PictureChoice::clear() {
 void PictureChoice::choose(int cell, const QString& record) {
     const PrintCode now = code(std::max(copies(cell), 1), PaperWords::All);
     m_copies[static_cast<std::size_t>(cell)] = now.copies;
-    put({now.compose(), record, path(cell)});
+    put({now.compose(), record, DrivePath(path(cell))});
 }
 
 void PictureChoice::setCopies(int cell, int copies, const QString& record) {
@@ -81,19 +81,19 @@ void PictureChoice::setCopies(int cell, int copies, const QString& record) {
     else if (index >= 0)
         m_basket.replaceAt(index, BasketLine::withCopies(m_basket.item(index), copies));
     else
-        put({code(copies, PaperWords::All).compose(), record, path(cell)});
+        put({code(copies, PaperWords::All).compose(), record, DrivePath(path(cell))});
 }
 
 void PictureChoice::chooseAll() {
     for (const QString& path : m_folders.paths().items())
-        put({code(1, PaperWords::WholeFolder).compose(), {}, path});
+        put({code(1, PaperWords::WholeFolder).compose(), {}, DrivePath(path)});
 }
 
 int PictureChoice::storeRecord(const QString& path, const QString& record) {
     const int index = m_basket.FindByPath(path);
     // The page in view may be another one by now, so that the copies are those of the line.
     if (index >= 0)
-        put({code(PrintCode::copiesOf(m_basket.item(index)), PaperWords::All).compose(), record, path});
+        put({code(PrintCode::copiesOf(m_basket.item(index)), PaperWords::All).compose(), record, DrivePath(path)});
     return index;
 }
 

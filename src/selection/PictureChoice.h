@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "selection/Basket.h"
 #include "selection/FolderPager.h"
 
@@ -31,7 +32,7 @@ public:
     // The edit record of a chosen picture in an order of the full form.
     std::optional<QString> recordOf(const QString& path) const;
 
-    int addFolder(const QString& folder, const QStringList& names) { return m_folders.addFolder(folder, names); }
+    int addFolder(const DrivePath& folder, const QStringList& names) { return m_folders.addFolder(folder, names); }
     void nextPage();
     void previousPage();
     // A page of the basket's own pictures, from its reading position on.

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "platform/line/Mail.h"
 
 #include <QDateTime>
@@ -60,8 +61,8 @@ struct ClientProfile {
     QString SettingsHost;   // host of the remote settings texts
     QString AdUrl1;
     QString AdUrl2;
-    QString AdFile1; // drive paths
-    QString AdFile2;
+    DrivePath AdFile1;
+    DrivePath AdFile2;
     std::int16_t ReportOn = 0;       // above 0: the reports are sent
     MailAccount mail;                // finished orders go through it; not set up: no mail step
     std::array<Shop, 2> Shops;       // rows of the delivery question
@@ -118,7 +119,7 @@ struct CouponState {
 // The picture last opened in the editor: the raw record, 200 characters, and its fields.
 struct EditFields {
     QString EditState;
-    QString PicturePath;
+    DrivePath PicturePath;
     QString TempRedName;
     float GainR = 1;
     float GainG = 1;
@@ -175,8 +176,8 @@ enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
 enum class Travel : std::int16_t { Whole = 0, Pieces = 1 };
 
 struct TransferState {
-    QString OrderFolder;       // full drive path of the order's folder
-    QString OrderLogBase;      // path of the order log without ".txt"
+    DrivePath OrderFolder;     // of the order that is being prepared, sent or looked at
+    DrivePath OrderLogBase;    // path of the order log without ".txt"
     QString ShemTikiya;        // leaf name of the order folder, also its name on the server
     std::int16_t HazmanaP = 0; // above 0: the folder's name ends in "P"
     Sender SugSheliach = Sender::Ftp;
@@ -196,7 +197,7 @@ struct HandOver {
 };
 
 struct SessionState {
-    QString DiskRoot; // "C:\", root of all workspace paths
+    DrivePath DiskRoot; // "C:\", root of all workspace paths
     OrderKind Optint = OrderKind::NotChosen;
     QString MisparHazmana = QStringLiteral("100"); // number of the order being built
     QString KodMishloach = QStringLiteral("   ");  // how the order started, three characters

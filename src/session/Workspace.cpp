@@ -1,7 +1,7 @@
 #include "session/Workspace.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "session/SessionState.h"
 
 #include <optional>
@@ -13,8 +13,8 @@ namespace {
 // The largest number that a counter is believed: it must fit, with one added, wherever an order number goes.
 constexpr long long largestNumber = 999999999;
 
-QString counterFolder(const SessionState& state) {
-    return state.DiskRoot + QStringLiteral("vedron");
+DrivePath counterFolder(const SessionState& state) {
+    return state.DiskRoot / u"vedron";
 }
 
 // Blanks in front are passed over and digits are taken up to the first other character: "007x" is 7, rubbish is 0.
@@ -43,52 +43,52 @@ std::optional<QString> firstLine(const QByteArray& bytes) {
 
 namespace WorkspacePaths {
 
-QString root(const SessionState& state) {
-    return state.DiskRoot + QStringLiteral("2000lumora");
+DrivePath root(const SessionState& state) {
+    return state.DiskRoot / u"2000lumora";
 }
 
-QString zmany(const SessionState& state) {
-    return root(state) + QStringLiteral("\\zmany");
+DrivePath zmany(const SessionState& state) {
+    return root(state) / u"zmany";
 }
 
-QString ktanim(const SessionState& state) {
-    return zmany(state) + QStringLiteral("\\ktanim");
+DrivePath ktanim(const SessionState& state) {
+    return zmany(state) / u"ktanim";
 }
 
-QString tempred(const SessionState& state) {
-    return zmany(state) + QStringLiteral("\\tempred");
+DrivePath tempred(const SessionState& state) {
+    return zmany(state) / u"tempred";
 }
 
-QString corrected(const SessionState& state, const QString& picture) {
-    return JoinDrivePath(tempred(state), MangleFileName(picture));
+DrivePath corrected(const SessionState& state, const DrivePath& picture) {
+    return tempred(state) / MangleFileName(picture);
 }
 
-QString jobFolder(const SessionState& state) {
-    return zmany(state) + QStringLiteral("\\job_folder");
+DrivePath jobFolder(const SessionState& state) {
+    return zmany(state) / u"job_folder";
 }
 
-QString misgarot(const SessionState& state) {
-    return root(state) + QStringLiteral("\\misgarot");
+DrivePath misgarot(const SessionState& state) {
+    return root(state) / u"misgarot";
 }
 
-QString orders(const SessionState& state) {
-    return root(state) + QStringLiteral("\\!!000");
+DrivePath orders(const SessionState& state) {
+    return root(state) / u"!!000";
 }
 
-QString scratchPicture(const SessionState& state) {
-    return orders(state) + QStringLiteral("\\^^^.jpg");
+DrivePath scratchPicture(const SessionState& state) {
+    return orders(state) / u"^^^.jpg";
 }
 
-QString counter(const SessionState& state) {
-    return counterFolder(state) + QStringLiteral("\\mispar.txt");
+DrivePath counter(const SessionState& state) {
+    return counterFolder(state) / u"mispar.txt";
 }
 
-QString toneCopy(const SessionState& state) {
-    return root(state) + QStringLiteral("\\bw.bmp");
+DrivePath toneCopy(const SessionState& state) {
+    return root(state) / u"bw.bmp";
 }
 
-QString proofPicture(const SessionState& state) {
-    return root(state) + QStringLiteral("\\000.jpg");
+DrivePath proofPicture(const SessionState& state) {
+    return root(state) / u"000.jpg";
 }
 
 } // namespace WorkspacePaths
@@ -101,7 +101,7 @@ bool Workspace::MakeRootFolders() const {
 }
 
 Result<void> Workspace::MakeWorkspace() const {
-    for (const QString& folder :
+    for (const DrivePath& folder :
          {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), WorkspacePaths::jobFolder(m_state),
           WorkspacePaths::ktanim(m_state), WorkspacePaths::tempred(m_state), WorkspacePaths::misgarot(m_state)}) {
         if (const Result<void> made = m_files.makeFolder(folder); !made)
@@ -119,9 +119,9 @@ Result<void> Workspace::MakeOrderFolder() const {
 }
 
 Result<void> Workspace::CleanWorkspace() const {
-    const QString orders = WorkspacePaths::orders(m_state);
+    const DrivePath orders = WorkspacePaths::orders(m_state);
     const struct {
-        QString folder;
+        DrivePath folder;
         QStringList endings;
     } scratch[] = {{WorkspacePaths::ktanim(m_state), {"jpg"}},
                    {WorkspacePaths::tempred(m_state), {"jpg"}},
@@ -132,9 +132,9 @@ Result<void> Workspace::CleanWorkspace() const {
             deleteMatching(place.folder, ending);
     }
 
-    const Result<void> written = m_files.writeWhole(orders + QStringLiteral("\\mana.txt"), QByteArrayLiteral("1\r\n"));
+    const Result<void> written = m_files.writeWhole(orders / u"mana.txt", QByteArrayLiteral("1\r\n"));
 
-    const QString counter = WorkspacePaths::counter(m_state);
+    const DrivePath counter = WorkspacePaths::counter(m_state);
     if (!m_files.fileExists(counter)) {
         m_state.MisparHazmana = QStringLiteral("100");
     } else if (const Result<QByteArray> bytes = m_files.read(counter)) {
@@ -143,19 +143,19 @@ Result<void> Workspace::CleanWorkspace() const {
             m_state.MisparHazmana = QString::number(counterValue(*line));
     }
 
-    (void)m_files.removeFile(orders + QStringLiteral("\\111.jpg"));
+    (void)m_files.removeFile(orders / u"111.jpg");
     return written;
 }
 
 void Workspace::CleanHistory() const {
-    const QString orders = WorkspacePaths::orders(m_state);
+    const DrivePath orders = WorkspacePaths::orders(m_state);
     for (const QString& order : m_files.folders(orders)) {
-        const QString folder = JoinDrivePath(orders, order);
+        const DrivePath folder = orders / order;
         const QStringList names = m_files.names(folder, QStringLiteral("*.*"));
         // The first file of a folder is its order sheet, which stays as the record of the order.
         for (qsizetype i = 1; i < names.size(); ++i) {
             if (names[i].endsWith(u"jpp"))
-                (void)m_files.removeFile(JoinDrivePath(folder, names[i]));
+                (void)m_files.removeFile(folder / names[i]);
         }
     }
 }
@@ -168,10 +168,10 @@ Result<void> Workspace::writeCounter() const {
 }
 
 // The pattern knows no letter case, the test of the ending does: "a.Jpg" stays, and so does what can't be deleted.
-void Workspace::deleteMatching(const QString& folder, const QString& ending) const {
+void Workspace::deleteMatching(const DrivePath& folder, const QString& ending) const {
     for (const QString& name : m_files.names(folder, QStringLiteral("*.") + ending)) {
         if (name.endsWith(ending) || name.endsWith(ending.toUpper()))
-            (void)m_files.removeFile(JoinDrivePath(folder, name));
+            (void)m_files.removeFile(folder / name);
     }
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "platform/files/Files.h"
 
@@ -9,20 +10,20 @@ namespace lumora {
 
 struct SessionState;
 
-// Paths of the workspace under the drive root. They are drive paths.
+// Paths of the workspace under the drive root.
 namespace WorkspacePaths {
-QString root(const SessionState& state);                              // 2000lumora
-QString zmany(const SessionState& state);                             // passing files
-QString ktanim(const SessionState& state);                            // small views that the editor stored
-QString tempred(const SessionState& state);                           // working files of the red-eye page
-QString corrected(const SessionState& state, const QString& picture); // in tempred: a picture's red-eye copy
-QString jobFolder(const SessionState& state);      // texts and thumbnails of the order in preparation
-QString misgarot(const SessionState& state);       // frames
-QString orders(const SessionState& state);         // !!000: staging, one sub-folder an order
-QString scratchPicture(const SessionState& state); // ^^^.jpg, the picture of the current step
-QString counter(const SessionState& state);        // vedron\mispar.txt
-QString toneCopy(const SessionState& state);       // bw.bmp: the grey picture that the latest toned print came from
-QString proofPicture(const SessionState& state);   // 000.jpg
+DrivePath root(const SessionState& state);                                // 2000lumora
+DrivePath zmany(const SessionState& state);                               // passing files
+DrivePath ktanim(const SessionState& state);                              // small views that the editor stored
+DrivePath tempred(const SessionState& state);                             // working files of the red-eye page
+DrivePath corrected(const SessionState& state, const DrivePath& picture); // in tempred: a picture's red-eye copy
+DrivePath jobFolder(const SessionState& state);      // texts and thumbnails of the order in preparation
+DrivePath misgarot(const SessionState& state);       // frames
+DrivePath orders(const SessionState& state);         // !!000: staging, one sub-folder an order
+DrivePath scratchPicture(const SessionState& state); // ^^^.jpg, the picture of the current step
+DrivePath counter(const SessionState& state);        // vedron\mispar.txt
+DrivePath toneCopy(const SessionState& state);       // bw.bmp: the grey picture that the latest toned print came from
+DrivePath proofPicture(const SessionState& state);   // 000.jpg
 } // namespace WorkspacePaths
 
 // The folder tree on the program's own drive and its clean-up before each order.
@@ -51,7 +52,7 @@ public:
     Result<void> writeCounter() const;
 
 private:
-    void deleteMatching(const QString& folder, const QString& ending) const;
+    void deleteMatching(const DrivePath& folder, const QString& ending) const;
 
     SessionState& m_state;
     const Files& m_files;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "platform/Platform.h"
 #include "session/Caption.h"
 #include "session/Page.h"
@@ -42,7 +43,7 @@ struct hatchalaControls : Controls {
     Caption Image2{*this, u"Image2"};                          // the same
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
     ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
-    QString Picture4; // drive path of the advertising picture; empty when there is none
+    DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
     // Seen by nobody: two buttons that code presses, and the service panel with the settings as one line of text.
     Caption Command1{*this, u"Command1", Caption::At::Hidden};
@@ -115,7 +116,7 @@ public:
     // Fetches the remote copy to the settings file. After a failure there is no such file.
     void DownloadSettings();
     // The lines of the settings file into List2; "No Server" for a file that is missing or is not this client's.
-    void ReadSettingsFile(const QString& path);
+    void ReadSettingsFile(const DrivePath& path);
     void SplitSettingsText(const QString& text);
 
     // --- state ---
@@ -156,7 +157,7 @@ private:
     void fetchSettings();
     void scramble();
     void unscramble();
-    QString settingsFile() const;
+    DrivePath settingsFile() const;
 
     SessionState& m_state;
     const Platform& m_platform;

@@ -1,7 +1,6 @@
 // What the start page has to have and no step of the program comes to: the service panel, the countdown, and the fetch
 // of the advertising picture.
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
 #include "platform/Dialogs.h"
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
@@ -54,13 +53,13 @@ void hatchala::fetchPicture() {
     Q_EMIT changed();
 }
 
-QString hatchala::settingsFile() const {
-    return JoinDrivePath(WorkspacePaths::root(m_state), m_state.profile.ClientCode + u".txt"_s);
+DrivePath hatchala::settingsFile() const {
+    return WorkspacePaths::root(m_state) / (m_state.profile.ClientCode + u".txt"_s);
 }
 
 void hatchala::BuildSettingsText() {
     const QString text = SettingsText(m_state.profile);
-    const QString path = settingsFile();
+    const DrivePath path = settingsFile();
     if (const Result<void> written = m_platform.files.writeWhole(path, AnsiCodePage::encode(text) + "\r\n"); !written)
         m_platform.dialogs.message(written.failure().message);
     Label5.text = text;
@@ -77,7 +76,7 @@ void hatchala::DownloadSettings() {
     const Workspace workspace(m_state, m_platform.files);
     if (!workspace.MakeRootFolders())
         return;
-    const QString path = settingsFile();
+    const DrivePath path = settingsFile();
     (void)m_platform.files.removeFile(path);
     // The caller learns of a failure from the file that is missing then.
     if (const auto target = m_platform.files.drives().toHost(path))
@@ -85,9 +84,9 @@ void hatchala::DownloadSettings() {
             u"http://%1/00natoonim/%2.txt"_s.arg(m_state.profile.SettingsHost, m_state.profile.ClientCode), *target);
 }
 
-void hatchala::ReadSettingsFile(const QString& path) {
+void hatchala::ReadSettingsFile(const DrivePath& path) {
     List2.clear();
-    const bool named = LeafName(path) == m_state.profile.ClientCode + u".txt"_s;
+    const bool named = path.leaf() == m_state.profile.ClientCode + u".txt"_s;
     const Result<qint64> size = m_platform.files.size(path);
     const Result<QByteArray> bytes = named && size && *size <= largestSettingsFile
                                          ? m_platform.files.read(path)

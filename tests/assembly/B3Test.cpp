@@ -38,12 +38,12 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     request.paper = {10, 15};
     EXPECT_EQ(content->picture, *renderEditedPrintToJpeg(request, fields));
 
-    EXPECT_EQ(*readPictureSize(host(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{450, 580}));
+    EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{450, 580}));
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
-    EXPECT_EQ(*readPictureSize(host(jobFolder + u"\\12~תמונה 01.bmp"_s)), (PictureSize{300, 450}));
-    EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_s)) << "goes at the end of each step";
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
-    EXPECT_EQ(state.transfer.OrderLogBase + u".txt"_s, logPath());
+    EXPECT_EQ(*readPictureSize(host(jobFolder / u"12~תמונה 01.bmp")), (PictureSize{300, 450}));
+    EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path)) << "goes at the end of each step";
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
+    EXPECT_EQ(state.transfer.OrderLogBase.text() + u".txt"_s, logPath().text());
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
@@ -90,13 +90,13 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     expectColour(print(5), middle, {grey(first).red(), grey(first).green(), grey(first).blue() / 2});
 
     // The last picture's copy; the corrected picture's is found under its own name too.
-    const auto copyOf = [this](const QString& path) { return loadPicture(host(path)); };
+    const auto copyOf = [this](const DrivePath& path) { return loadPicture(host(path)); };
     ASSERT_TRUE(copyOf(bw));
     EXPECT_EQ(copyOf(bw)->width(), 40) << "the size of the picture";
     expectColour(copyOf(bw)->image(), {20, 15}, grey(first));
-    ASSERT_TRUE(copyOf(correctedPath(bw)));
-    expectColour(copyOf(correctedPath(bw))->image(), {20, 15}, grey(fixed));
-    EXPECT_EQ(machine.files.names(u"C:\\2000lumora"_s, u"*.bmp"_s), QStringList(u"bw.bmp"_s));
+    ASSERT_TRUE(copyOf(correctedPath(bw.text())));
+    expectColour(copyOf(correctedPath(bw.text()))->image(), {20, 15}, grey(fixed));
+    EXPECT_EQ(machine.files.names(u"C:\\2000lumora"_path, u"*.bmp"_s), QStringList(u"bw.bmp"_s));
 }
 
 TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
@@ -108,10 +108,10 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
     const QString unknown = u"C:\\pics\\????.jpg"_s;
     // What an earlier customer's order left behind.
     ASSERT_TRUE(Bitmap(40, 30, Qt::blue).image().save(hostText(bw), "BMP"));
-    giveCorrected(bw, Qt::blue);
-    makeFolder(folder().left(21));
+    giveCorrected(bw.text(), Qt::blue);
+    makeFolder(folder().parent());
     giveFile(u"old.jpg"_s, *encodeJpeg(Bitmap(40, 30, Qt::blue), 90));
-    ASSERT_TRUE(machine.files.copyFile(u"C:\\pics\\old.jpg"_s, u"C:\\2000lumora\\!!000\\^^^.jpg"_s));
+    ASSERT_TRUE(machine.files.copyFile(u"C:\\pics\\old.jpg"_path, u"C:\\2000lumora\\!!000\\^^^.jpg"_path));
     const QStringList failed = prepare({edited(damaged, record(toned)), edited(good, record(toned)),
                                         edited(damaged, record(toned)), edited(vanished, record(redEyesCorrected)),
                                         edited(both4, record(both)), edited(missing), edited(unknown)});
@@ -161,7 +161,7 @@ TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
     const Changes turnedRed = {{EditRecord::GainR, u"0"_s}};
     prepare({edited(red), edited(green), edited(upright, record(turnedRed))});
     EXPECT_EQ(printFiles().size(), 3);
-    const QImage sheet = loadPicture(host(folder() + u"\\!105_1234.jpp"_s))->image();
+    const QImage sheet = loadPicture(host(folder() / u"!105_1234.jpp"))->image();
     // Cells lie every 82 pixels from 5, the first row at 161; a thumbnail is 80 wide and 53 high, also an upright one.
     expectColour(sheet, {5 + 40, 161 + 26}, Qt::green);
     expectColour(sheet, {87 + 76, 161 + 26}, Qt::black);
@@ -196,7 +196,7 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
         QStringList wanted;
         for (const QString& name : c.sheets)
             wanted += name.arg(number);
-        const QString place = folder(state.MisparHazmana);
+        const DrivePath place = folder(state.MisparHazmana);
         EXPECT_EQ(machine.files.names(place, u"!*"_s), wanted) << number;
         EXPECT_EQ(checkOrderFolder(host(place), {56, 30})->faults, QStringList());
         EXPECT_EQ(front(), c.front) << number;
@@ -215,7 +215,7 @@ TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPreparesAndCountsAfterTh
         page.Timer2_Tick();
         if (page.controls().Label17.text.isEmpty())
             return;
-        countedEarly = countedEarly || exists(u"C:\\vedron\\mispar.txt"_s) || exists(logPath());
+        countedEarly = countedEarly || exists(u"C:\\vedron\\mispar.txt"_path) || exists(logPath());
         if (positions.value(positions.size() - 1) != page.controls().Label17.text)
             positions += page.controls().Label17.text;
         EXPECT_EQ(page.controls().List2.currentIndex() + 1, page.controls().Label17.text.toInt());
@@ -242,7 +242,7 @@ TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     EXPECT_TRUE(chain.hasEnded());
     EXPECT_LT(printFiles().size(), 5);
     EXPECT_FALSE(exists(logPath()));
-    EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_s)) << "an abandoned order burns no number";
+    EXPECT_FALSE(exists(u"C:\\vedron\\mispar.txt"_path)) << "an abandoned order burns no number";
     for (const auto& entry : std::filesystem::directory_iterator(host(u"C:\\2000lumora"_s)))
         EXPECT_TRUE(entry.is_directory() || entry.path().filename() == "bw.bmp") << entry.path();
 }

@@ -3,10 +3,10 @@
 #include "PlainOrder.h"
 
 #include "assembly/edited/B3.h"
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "editing/editor/gdisave.h"
 #include "order/EditRecord.h"
+#include "session/Workspace.h"
 
 namespace lumora {
 
@@ -58,11 +58,9 @@ protected:
     void giveCorrected(const QString& path, QColor colour) {
         EXPECT_TRUE(Bitmap(40, 30, colour).image().save(hostText(correctedPath(path)), "BMP"));
     }
-    static QString correctedPath(const QString& path) {
-        return u"C:\\2000lumora\\zmany\\tempred\\"_s + MangleFileName(path);
-    }
-    QString hostText(const QString& path) const { return toText(host(path)); }
-    bool exists(const QString& path) const { return machine.files.fileExists(path); }
+    DrivePath correctedPath(const QString& path) const { return WorkspacePaths::corrected(state, DrivePath(path)); }
+    QString hostText(const DrivePath& path) const { return toText(host(path)); }
+    bool exists(const DrivePath& path) const { return machine.files.fileExists(path); }
 
     // The picture inside the print file of that place in the list.
     QImage print(int index) const {
@@ -80,8 +78,8 @@ protected:
         EXPECT_NEAR(found.blue(), wanted.blue(), 4);
     }
 
-    const QString bw = u"C:\\2000lumora\\bw.bmp"_s;
-    const QString jobFolder = u"C:\\2000lumora\\zmany\\job_folder"_s;
+    const DrivePath bw = u"C:\\2000lumora\\bw.bmp"_path;
+    const DrivePath jobFolder = u"C:\\2000lumora\\zmany\\job_folder"_path;
 };
 
 } // namespace lumora

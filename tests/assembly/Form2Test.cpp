@@ -23,15 +23,16 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(print->tail, "1 1 03-1234567Dana Levi 13 1051234      ");
     ASSERT_TRUE(giveFile(u"print.jpg"_s, print->picture).size() > 0);
     EXPECT_EQ(*readPictureSize(host(u"C:\\pics\\print.jpg"_s)), (PictureSize{1200, 1600}));
-    EXPECT_EQ(*readPictureSize(host(folder() + u"\\!105_1234.jpp"_s)), (PictureSize{500, 480}));
+    EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{500, 480}));
 
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the number in memory stays this order's";
     EXPECT_EQ(state.shemot.TotalPics, 13);
     EXPECT_EQ(state.transfer.OrderFolder, folder());
-    EXPECT_EQ(state.transfer.OrderLogBase + u".txt"_s, logPath());
+    EXPECT_EQ(state.transfer.OrderLogBase.text() + u".txt"_s, logPath().text());
     EXPECT_EQ(state.transfer.SugMishloah, Sending::NewOrder) << "a resend before does not leak into a new order";
-    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\^^^.jpg"_s)) << "stays for the next step to replace";
+    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path))
+        << "stays for the next step to replace";
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::Form2), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
@@ -117,7 +118,7 @@ TEST_F(PreparingAPlainOrder, saysSoWhenNothingIsLeftAndTakesNoNumber) {
     Form2& page = openWith({line(u"C:\\pics\\a.txt"_s), line(u"C:\\pics\\b.Jpg"_s)});
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2) << "empty only in the second walk";
-    EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_s));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_path));
     EXPECT_FALSE(machine.files.folderExists(folder()));
     EXPECT_FALSE(page.isPreparing());
     EXPECT_TRUE(page.controls().Command3.enabled);
@@ -139,7 +140,7 @@ TEST_F(PreparingAPlainOrder, takesNoSecondPressAndNoRemovalWhileItPrepares) {
     EXPECT_FALSE(enabledMeanwhile);
     EXPECT_EQ(printFiles().size(), 2);
     EXPECT_FALSE(machine.files.folderExists(folder(u"106"_s)));
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "106\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
 }
 
 TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
@@ -155,22 +156,23 @@ TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     EXPECT_TRUE(chain.hasEnded());
     EXPECT_LT(printFiles().size(), 5);
     EXPECT_FALSE(machine.files.fileExists(logPath()));
-    EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_s)) << "an abandoned order burns no number";
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_path)) << "an abandoned order burns no number";
 }
 
 TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinishedOrders) {
     // One was given up today, one yesterday, before the counter was written.
-    const QStringList unfinished = {folder(), u"C:\\2000lumora\\!!000\\2026_11_20_KUP_1234^106"_s};
-    for (const QString& left : unfinished) {
+    const DrivePath unfinished[] = {folder(), u"C:\\2000lumora\\!!000\\2026_11_20_KUP_1234^106"_path};
+    for (const DrivePath& left : unfinished) {
         makeFolder(left);
-        ASSERT_TRUE(machine.files.writeWhole(left + u"\\9 1015GNB0009_0161.jpp"_s, "old"));
+        ASSERT_TRUE(machine.files.writeWhole(left / u"9 1015GNB0009_0161.jpp", "old"));
     }
     const QString picture = line(givePicture(u"one.jpg"_s));
     openWith({picture}).Command6_Click();
     EXPECT_EQ(state.MisparHazmana, u"107"_s);
     EXPECT_EQ(printFiles(u"107"_s), QStringList(u"1 1015GNB0000_016F6E65.jpp"_s));
-    for (const QString& left : unfinished)
-        EXPECT_EQ(machine.files.names(left, u"*"_s), QStringList(u"9 1015GNB0009_0161.jpp"_s)) << left.toStdString();
+    for (const DrivePath& left : unfinished)
+        EXPECT_EQ(machine.files.names(left, u"*"_s), QStringList(u"9 1015GNB0009_0161.jpp"_s))
+            << left.text().toStdString();
 
     // The counter is lost, and the number comes again.
     const QByteArray finished = *machine.files.read(logPath(u"107"_s));
@@ -181,9 +183,9 @@ TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinished
     EXPECT_EQ(printFiles(u"107"_s).size(), 1);
     EXPECT_EQ(*machine.files.read(logPath(u"107"_s)), finished);
     EXPECT_EQ(printFiles(u"108"_s).size(), 2);
-    EXPECT_TRUE(machine.files.fileExists(folder(u"108"_s) + u"\\!108_1234.jpp"_s));
+    EXPECT_TRUE(machine.files.fileExists(folder(u"108"_s) / u"!108_1234.jpp"));
     EXPECT_TRUE(machine.files.read(logPath(u"108"_s))->contains("KUP_1234^108\""));
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_s), "109\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "109\r\n");
 }
 
 TEST_F(PreparingAPlainOrder, marksTheFolderOfAReopenedOrder) {
@@ -191,7 +193,7 @@ TEST_F(PreparingAPlainOrder, marksTheFolderOfAReopenedOrder) {
     openWith({line(givePicture(u"one.jpg"_s))}).Command6_Click();
     EXPECT_EQ(printFiles(u"105P"_s).size(), 1);
     EXPECT_TRUE(machine.files.fileExists(logPath(u"105P"_s)));
-    EXPECT_TRUE(machine.files.fileExists(folder(u"105P"_s) + u"\\!105_1234.jpp"_s));
+    EXPECT_TRUE(machine.files.fileExists(folder(u"105P"_s) / u"!105_1234.jpp"));
 }
 
 TEST_F(PreparingAPlainOrder, keepsTheOrderAtALocalStationAndTellsItsNumberOnTheStartPage) {
@@ -208,13 +210,13 @@ TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) 
     state.Optint = OrderKind::Sequence;
     openWith({line(givePicture(u"one.jpg"_s))}).Command6_Click();
     EXPECT_EQ(front(), PageId::MoogMeret);
-    EXPECT_EQ(state.handOver.lines, QStringList(state.transfer.OrderLogBase));
+    EXPECT_EQ(state.handOver.lines, QStringList(state.transfer.OrderLogBase.text()));
 }
 
 TEST_F(PreparingAPlainOrder, tellsOfAPrintFileThatCanNotBeWrittenAndGoesOn) {
     const QString one = givePicture(u"one.jpg"_s);
     Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
-    onceClaimed([&] { makeFolder(folder() + u"\\1 1015GNB0000_016F6E65.jpp"_s); });
+    onceClaimed([&] { makeFolder(folder() / u"1 1015GNB0000_016F6E65.jpp"); });
     const TextList& failed = page.controls().List4fail;
     page.Command6_Click();
     EXPECT_EQ(failed.items(), QStringList(one));
@@ -289,7 +291,7 @@ protected:
 
 TEST_F(PreparingAnAlbum, drawsItsOwnSheetWithTheContactSheetBelow) {
     openWith({albumLine(givePicture(u"one.jpg"_s))}).Command6_Click();
-    const Result<Bitmap> sheet = loadPicture(host(folder() + u"\\!105_1234.jpp"_s));
+    const Result<Bitmap> sheet = loadPicture(host(folder() / u"!105_1234.jpp"));
     ASSERT_TRUE(sheet);
     const auto near = [&](QPoint at, QColor wanted) {
         const QColor found = sheet->image().pixelColor(at);

@@ -42,7 +42,7 @@ TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
         for (const QString& name : made)
             EXPECT_TRUE(unpacked(name)) << name.toStdString();
         for (int i = 0; i < pictures; ++i)
-            EXPECT_TRUE(machine.files.fileExists(u"C:\\pics\\pic%1.jpg"_s.arg(i)));
+            EXPECT_TRUE(machine.files.fileExists(DrivePath(u"C:\\pics\\pic%1.jpg"_s.arg(i))));
     }
 }
 

@@ -20,7 +20,7 @@ protected:
     }
     // The faults after a change to a file of the folder; the file is put back.
     QStringList faultsWith(const QString& name, const std::function<void(QByteArray&)>& change) const {
-        const QString path = folder() + u'\\' + name;
+        const DrivePath path = folder() / name;
         const QByteArray before = *machine.files.read(path);
         QByteArray changed = before;
         change(changed);
@@ -63,14 +63,14 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
         3)
         << "the total and the tails of both print files";
     // A print file whose picture is cut short still falls into its pieces.
-    const QByteArray tail = readPrintFile(*machine.files.read(folder() + u'\\' + two), {56, 30})->tail;
+    const QByteArray tail = readPrintFile(*machine.files.read(folder() / two), {56, 30})->tail;
     QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);
     picture.chop(picture.size() / 2);
     oneFault(faultsWith(two, [&](QByteArray& bytes) { bytes = *packPrintFile(picture, {56, 30}, tail); }), two);
 
-    ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + two));
+    ASSERT_TRUE(machine.files.removeFile(folder() / two));
     oneFault(faults(), u"two.jpg"_s);
-    ASSERT_TRUE(machine.files.removeFile(folder() + u'\\' + log));
+    ASSERT_TRUE(machine.files.removeFile(folder() / log));
     oneFault(faults(), u"no order log"_s);
 }
 

@@ -39,14 +39,14 @@ protected:
     }
 
     QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
-        const QString path = u"C:\\pics\\"_s + name;
+        const DrivePath path = u"C:\\pics"_path / name;
         EXPECT_TRUE(machine.files.writeWhole(path, *encodeJpeg(Bitmap(width, height, colour), 92)));
-        return path;
+        return path.text();
     }
     QString giveFile(const QString& name, const QByteArray& bytes) {
-        const QString path = u"C:\\pics\\"_s + name;
+        const DrivePath path = u"C:\\pics"_path / name;
         EXPECT_TRUE(machine.files.writeWhole(path, bytes));
-        return path;
+        return path.text();
     }
 
     static QString line(const QString& path, const QString& copies = u"1 "_s) { return copies + u"1015GNB"_s + path; }
@@ -67,11 +67,11 @@ protected:
         };
     }
 
-    QString folder(const QString& number = u"105"_s) const {
-        return u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^"_s + number;
+    DrivePath folder(const QString& number = u"105"_s) const {
+        return u"C:\\2000lumora\\!!000"_path / (u"2026_11_21_KUP_1234^"_s + number);
     }
-    QString logPath(const QString& number = u"105"_s) const {
-        return folder(number) + u"\\2026_11_21_KUP_1234^"_s + number + u".txt"_s;
+    DrivePath logPath(const QString& number = u"105"_s) const {
+        return folder(number) / (u"2026_11_21_KUP_1234^"_s + number + u".txt"_s);
     }
     QStringList printFiles(const QString& number = u"105"_s) const {
         QStringList names = machine.files.names(folder(number), u"*.jpp"_s);
@@ -80,7 +80,7 @@ protected:
     }
     // The picture inside a print file.
     Result<PrintFileContent> unpacked(const QString& name, const QString& number = u"105"_s) const {
-        const Result<QByteArray> bytes = machine.files.read(folder(number) + u'\\' + name);
+        const Result<QByteArray> bytes = machine.files.read(folder(number) / name);
         return bytes ? readPrintFile(*bytes, PrintFileShape::of(state.profile))
                      : Result<PrintFileContent>(bytes.failure());
     }

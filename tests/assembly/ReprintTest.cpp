@@ -19,13 +19,13 @@ protected:
 
     QStringList dozen() {
         makeFolder(u"C:\\pics\\more"_s);
-        const QString frames = u"C:\\2000lumora\\misgarot\\demo"_s;
+        const DrivePath frames = u"C:\\2000lumora\\misgarot\\demo"_path;
         makeFolder(frames);
         Bitmap frame(60, 40, Qt::black);
         frame.image().fill(Qt::black);
         for (int x = 0; x < 60; ++x)
             frame.image().setPixelColor(x, x % 40, QColor(90, 20, 160));
-        EXPECT_TRUE(frame.image().save(hostText(frames + u"\\007.bmp"_s), "BMP"));
+        EXPECT_TRUE(frame.image().save(hostText(frames / u"007.bmp"), "BMP"));
 
         using namespace EditRecord;
         const Changes framed = {{FrameName, u"007"_s}, {FrameFolder, u"demo"_s}};
@@ -92,12 +92,12 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
         EXPECT_TRUE(first[i] == second[i]) << "whatever was under way beside it";
         const BasketLine item = BasketLine::split(lines[i], LineForm::Full);
         const bool isCorrected = item.editState.contains(QLatin1String("RED"));
-        const QString source = hostText(isCorrected ? correctedPath(item.path) : item.path);
+        const QString source = hostText(isCorrected ? correctedPath(item.path.text()) : item.path);
         const QTemporaryDir out;
         QProcess render;
         render.start(QStringLiteral(LUMORA_RENDER),
                      {u"print"_s, u"--paper"_s, u"10/15"_s, u"--record"_s, item.editState, u"--frames"_s,
-                      hostText(u"C:\\2000lumora\\misgarot"_s), u"--out"_s, out.path(), source});
+                      hostText(u"C:\\2000lumora\\misgarot"_path), u"--out"_s, out.path(), source});
         ASSERT_TRUE(render.waitForFinished(60000));
         ASSERT_EQ(render.exitCode(), 0) << render.readAllStandardError().constData();
         const QStringList made = QDir(out.path()).entryList(QDir::Files);

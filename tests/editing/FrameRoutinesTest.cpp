@@ -17,22 +17,22 @@ class FrameRoutines : public ::testing::Test {
 protected:
     FrameRoutines() {
         state.DiskRoot = machine.drives.programRoot();
-        EXPECT_TRUE(machine.files.makeFolder(u"C:\\2000lumora"_s).ok());
+        EXPECT_TRUE(machine.files.makeFolder(u"C:\\2000lumora"_path).ok());
     }
-    QByteArray read(const QString& path) {
+    QByteArray read(const DrivePath& path) {
         const auto bytes = machine.files.read(path);
         return bytes ? *bytes : QByteArray("unreadable");
     }
-    void write(const QString& path, const QByteArray& bytes) {
+    void write(const DrivePath& path, const QByteArray& bytes) {
         ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok());
     }
 
     TestPlatform machine;
     SessionState state;
-    const QString frame = u"C:\\frame.bmp"_s;
-    const QString results = u"C:\\2000lumora\\!!moozpanim"_s;
-    const QString pieces = u"C:\\2000lumora\\!!benaime"_s;
-    const QString packed = results + u"\\!k.bmp"_s;
+    const DrivePath frame = u"C:\\frame.bmp"_path;
+    const DrivePath results = u"C:\\2000lumora\\!!moozpanim"_path;
+    const DrivePath pieces = u"C:\\2000lumora\\!!benaime"_path;
+    const DrivePath packed = results / u"!k.bmp";
 };
 
 const ChannelMinimums minimums{{1, 2.5F, 0.001F}, {-4, 0, 255}, {0.4F, 100000, 33.25F}};
@@ -50,7 +50,7 @@ TEST_F(FrameRoutines, ChannelMinimumsAreWrittenGreenBlueRedAndReadInAnyOrderAndP
     ChannelMinimums found;
     ASSERT_TRUE(found.readFrom(machine.files, frame).ok());
     EXPECT_EQ(found, minimums);
-    ASSERT_TRUE(found.readFrom(machine.files, u"C:\\none.txt"_s).ok());
+    ASSERT_TRUE(found.readFrom(machine.files, u"C:\\none.txt"_path).ok());
     EXPECT_EQ(found, minimums) << "what a file does not say stays";
     write(frame, "\"TKN.A_R_MIN(2)\",\"7.5 or so\"\r\n\"TKN.A_X_MIN(1)\",9\r\nno key\r\n\"TKN.A_R_MIN(4)\",9\r\n");
     ASSERT_TRUE(found.readFrom(machine.files, frame).ok());
@@ -63,7 +63,7 @@ TEST_F(FrameRoutines, ScramblingExchangesTheFirstTwoBlocksAndUndoesItself) {
     write(frame, QByteArray(99'999, 'a'));
     const auto small = ScrambleFrameFile(state, machine.files, frame);
     ASSERT_TRUE(small.ok());
-    EXPECT_EQ(*small, QString()) << "too small";
+    EXPECT_EQ(*small, DrivePath()) << "too small";
     EXPECT_FALSE(machine.files.folderExists(results));
 
     QByteArray bytes;
@@ -71,7 +71,7 @@ TEST_F(FrameRoutines, ScramblingExchangesTheFirstTwoBlocksAndUndoesItself) {
         bytes.append(static_cast<char>(i * 7 + i / 251));
     write(frame, bytes);
     ASSERT_TRUE(machine.files.makeFolder(pieces).ok());
-    write(pieces + u"\\kzz.bmp"_s, "left by an interrupted run");
+    write(pieces / u"kzz.bmp", "left by an interrupted run");
     const auto once = ScrambleFrameFile(state, machine.files, frame);
     ASSERT_TRUE(once.ok());
     EXPECT_EQ(*once, packed);
@@ -83,7 +83,7 @@ TEST_F(FrameRoutines, ScramblingExchangesTheFirstTwoBlocksAndUndoesItself) {
 }
 
 TEST_F(FrameRoutines, AScramblingThatFailsLosesNothing) {
-    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, u"C:\\none.bmp"_s).ok());
+    EXPECT_FALSE(ScrambleFrameFile(state, machine.files, u"C:\\none.bmp"_path).ok());
     write(frame, QByteArray(120'000, 'a'));
     write(results, "in the way of the folder");
     EXPECT_FALSE(ScrambleFrameFile(state, machine.files, frame).ok());

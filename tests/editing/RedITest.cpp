@@ -19,8 +19,8 @@ namespace {
 
 constexpr QRgb skin = qRgb(180, 140, 120);
 constexpr QRgb pupil = qRgb(210, 42, 58);
-const QString undoCopy = u"C:\\2000lumora\\zmany\\tempred\\000.bmp"_s;
-const QString correctedCopy = u"C:\\2000lumora\\zmany\\tempred\\C;]pics]eyes.jpg"_s;
+const DrivePath undoCopy = u"C:\\2000lumora\\zmany\\tempred\\000.bmp"_path;
+const DrivePath correctedCopy = u"C:\\2000lumora\\zmany\\tempred\\C;]pics]eyes.jpg"_path;
 
 // Two pupils of 9 pixels, and one at the very corner.
 constexpr QPoint leftEye{60, 50};
@@ -44,7 +44,7 @@ protected:
 
     // Without loss, whatever the name's ending says.
     void save(const Bitmap& picture) {
-        state.edit.PicturePath = u"C:\\pics\\eyes.jpg"_s;
+        state.edit.PicturePath = u"C:\\pics\\eyes.jpg"_path;
         ASSERT_TRUE(picture.image().save(toText(host(state.edit.PicturePath)), "PNG"));
         original = picture.image();
         customersFile = *machine.files.read(state.edit.PicturePath);
@@ -73,7 +73,7 @@ protected:
         pick(page, at);
         page.Image2_Click();
     }
-    QImage pictureIn(const QString& path) const {
+    QImage pictureIn(const DrivePath& path) const {
         const Result<Bitmap> picture = loadPicture(host(path));
         return picture ? picture->image().convertToFormat(QImage::Format_RGB32) : QImage();
     }
@@ -165,7 +165,7 @@ TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwnAndTheNextVisitStartsFromTheCustomers
     page.Image8_Click();
     EXPECT_FALSE(isOpen());
     EXPECT_EQ(state.edit.EditState.mid(38, 3), u"RED"_s);
-    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\job_folder\\red_folder"_s));
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\job_folder\\red_folder"_path));
     EXPECT_EQ(machine.files.read(correctedCopy)->left(2), "BM");
     EXPECT_EQ(pictureIn(correctedCopy), corrected);
     EXPECT_EQ(*machine.files.read(state.edit.PicturePath), customersFile);
@@ -392,10 +392,10 @@ TEST(RedEyeOverview, Is250WideOr300High) {
 }
 
 TEST_F(RedEyePage, TellsAPictureThatCannotBeOpenedAndCloses) {
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\pics\\broken.jpg"_s, "\xFF\xD8\xFF\xE0 broken"));
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\pics\\broken.jpg"_path, "\xFF\xD8\xFF\xE0 broken"));
     for (const char* path : {"C:\\pics\\broken.jpg", "C:\\pics\\missing.jpg", "", "Q:\\a.jpg"}) {
         machine.dialogs.messages.clear();
-        chain.load<RedI>().open(QString::fromLatin1(path));
+        chain.load<RedI>().open(DrivePath(QString::fromLatin1(path)));
         EXPECT_FALSE(isOpen()) << path;
         EXPECT_EQ(machine.dialogs.messages.size(), 1) << path;
     }

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "editing/caption/mikledet.h"
 #include "editing/editor/BigPics.h"
@@ -14,8 +13,8 @@
 
 namespace lumora {
 
-inline const QString lying = u"C:\\p\\lying.jpg"_s;
-inline const QString standing = u"C:\\p\\standing.jpg"_s;
+inline const DrivePath lying = u"C:\\p\\lying.jpg"_path;
+inline const DrivePath standing = u"C:\\p\\standing.jpg"_path;
 
 // The editor on a fresh drive with two red pictures. stored: the records that it gave away since a picture was opened.
 class TheEditor : public testing::Test, protected PageRig {
@@ -34,15 +33,15 @@ protected:
         registerBare({PageId::kyoskNew});
     }
 
-    void savePicture(const QString& path, PictureSize size, QColor colour) {
+    void savePicture(const DrivePath& path, PictureSize size, QColor colour) {
         EXPECT_TRUE(saveJpeg(Bitmap(size.width, size.height, colour), host(path), 95));
     }
     // A frame of the preview with the list files that the categories are read by.
     void makeFrame(const QString& category, const QString& name, QColor colour) {
-        const QString folder = JoinDrivePath(WorkspacePaths::misgarot(state), category);
+        const DrivePath folder = WorkspacePaths::misgarot(state) / category;
         EXPECT_TRUE(machine.files.makeFolder(folder));
         for (const QString& leaf : {u'k' + name + u".bmp"_s, name + u".bmp"_s, name + u".png"_s})
-            EXPECT_TRUE(Bitmap(30, 20, colour).image().save(toText(host(JoinDrivePath(folder, leaf)))));
+            EXPECT_TRUE(Bitmap(30, 20, colour).image().save(toText(host(folder / leaf))));
     }
 
     // The page, its stores recorded.
@@ -54,7 +53,7 @@ protected:
         }
         return *made;
     }
-    tFrmNew& open(const QString& picture, const QString& record = EditRecord::newPicture()) {
+    tFrmNew& open(const DrivePath& picture, const QString& record = EditRecord::newPicture()) {
         tFrmNew& editor = page();
         chain.show(PageId::tFrmNew);
         UnpackEditState(record, state.edit);

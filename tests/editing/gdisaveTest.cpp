@@ -11,7 +11,7 @@ namespace {
 class SavingPictures : public ::testing::Test, protected PageRig {
 protected:
     SavingPictures() {
-        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000\\order"_s;
+        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000\\order"_path;
         state.MisparHazmana = u"105"_s;
         state.shemot.ser = u"1234"_s;
         makeFolder(state.transfer.OrderFolder);
@@ -21,12 +21,12 @@ protected:
     }
 
     gdisave& page() { return chain.load<gdisave>(); }
-    bool isPicture(const QString& path, PictureSize size) {
+    bool isPicture(const DrivePath& path, PictureSize size) {
         const Result<PictureSize> found = readPictureSize(host(path));
         return found && *found == size;
     }
-    static QString sheet(const char* extension) {
-        return u"C:\\2000lumora\\!!000\\order\\!105_1234"_s + QString::fromLatin1(extension);
+    static DrivePath sheet(const char* extension) {
+        return u"C:\\2000lumora\\!!000\\order"_path / (u"!105_1234"_s + QString::fromLatin1(extension));
     }
 
     const Bitmap picture{20, 10, Qt::red};
@@ -40,8 +40,8 @@ TEST_F(SavingPictures, savesEachPictureUnderItsNameOnceTheDrawingStarted) {
         page().saveScratch(picture);
         page().saveOrderSheet(picture);
         page().saveProof(small);
-        EXPECT_EQ(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_s, {20, 10}), started);
-        EXPECT_EQ(isPicture(u"C:\\2000lumora\\000.jpg"_s, {8, 6}), started);
+        EXPECT_EQ(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_path, {20, 10}), started);
+        EXPECT_EQ(isPicture(u"C:\\2000lumora\\000.jpg"_path, {8, 6}), started);
         EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), started);
         EXPECT_EQ(machine.dialogs.messages,
                   QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
@@ -68,9 +68,9 @@ TEST_F(SavingPictures, theSheetsNameFollowsTheSenderAndTheStation) {
 }
 
 TEST_F(SavingPictures, tellsWhyAPictureCouldNotBeSavedAndGoesOn) {
-    EXPECT_FALSE(page().SaveJpeg(picture, u"C:\\missing\\a.jpg"_s, 90));
-    EXPECT_FALSE(page().SaveJpeg({}, u"C:\\2000lumora\\a.jpg"_s, 90));
-    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\a.jpg"_s));
+    EXPECT_FALSE(page().SaveJpeg(picture, u"C:\\missing\\a.jpg"_path, 90));
+    EXPECT_FALSE(page().SaveJpeg({}, u"C:\\2000lumora\\a.jpg"_path, 90));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\a.jpg"_path));
     ASSERT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_TRUE(machine.dialogs.messages[0].startsWith(u"File Not Found. GDI+ Error:10\n"_s));
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"C:\\missing\\a.jpg"_s));

@@ -27,7 +27,7 @@ TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
     makeFrame(u"much too long"_s, u"001"_s, Qt::green);
     makeFrame(u"aa"_s, u"long"_s, Qt::green);
     makeFrame(u"aa"_s, u"K9"_s, Qt::green);
-    const HostPath listFile = host(JoinDrivePath(WorkspacePaths::misgarot(state), u"aa\\002.png"_s));
+    const HostPath listFile = host(WorkspacePaths::misgarot(state) / u"aa\\002.png");
     std::filesystem::rename(listFile, HostPath(listFile).replace_extension("PNG")); // letter case does not count
     tFrmNew& editor = open(lying);
     EXPECT_EQ(shown().Combo4List.items(), QStringList({u"aa"_s, u"bb"_s}));

@@ -196,7 +196,7 @@ TEST_F(TheEditor, greysThePictureOnceWhateverTonesFollow) {
 }
 
 TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
-    const QString copy = JoinDrivePath(WorkspacePaths::tempred(state), MangleFileName(lying));
+    const DrivePath copy = WorkspacePaths::corrected(state, lying);
     ASSERT_TRUE(Bitmap(400, 300, Qt::blue).image().save(toText(host(copy)), "BMP"));
     const QString before =
         recordWith(EditRecord::RedMarker, u"RED"_s).replace(32, 3, u"017"_s).replace(126, 4, u"Dana"_s);
@@ -224,16 +224,16 @@ TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
     EXPECT_GT(middle().red(), 240);
     EXPECT_EQ(field(EditRecord::RedMarker), u"000"_s);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(copy));
+    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(copy.text()));
 }
 
 TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\bad.jpg"_s, "no picture"));
-    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\0.bmp"_s)); // where the work picture would be written
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\bad.jpg"_path, "no picture"));
+    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\0.bmp"_path)); // where the work picture would be written
     open(lying);
     open(standing);
     EXPECT_EQ(machine.dialogs.messages.size(), 1) << "told once";
-    tFrmNew& editor = open(u"C:\\p\\bad.jpg"_s);
+    tFrmNew& editor = open(u"C:\\p\\bad.jpg"_path);
     EXPECT_EQ(machine.dialogs.messages.size(), 2);
     EXPECT_FALSE(editor.pictureOpen());
     EXPECT_TRUE(paper().isNull());
@@ -349,8 +349,8 @@ TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
 
 TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {
     tFrmNew& editor = open(lying);
-    QStringList picked;
-    QObject::connect(&editor, &tFrmNew::picked, [&](const QString& path) { picked += path; });
+    QList<DrivePath> picked;
+    QObject::connect(&editor, &tFrmNew::picked, [&](const DrivePath& path) { picked += path; });
     editor.Image2_Click(6);
     const QString before = state.edit.EditState;
     editor.Command2_Click();
@@ -358,7 +358,7 @@ TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {
     EXPECT_EQ(state.edit.GainR, 1.06F);
     machine.dialogs.picks += standing;
     editor.Command2_Click();
-    EXPECT_EQ(picked, QStringList({standing}));
+    EXPECT_EQ(picked, QList<DrivePath>({standing}));
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(state.edit.EditState, before);
     EXPECT_EQ(machine.dialogs.pickRequests.size(), 2);

@@ -8,7 +8,7 @@ namespace {
 using Panel = AlbumPanels::Panel;
 
 constexpr int albumTile = 6;
-const QString photographerStore = u"C:\\2000lumora\\pratim2.txt"_s;
+const DrivePath photographerStore = u"C:\\2000lumora\\pratim2.txt"_path;
 
 class AlbumTest : public DetailsPageTest {
 protected:

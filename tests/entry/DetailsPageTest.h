@@ -27,7 +27,7 @@ protected:
         return static_cast<nnn&>(*chain.front());
     }
 
-    const QString customerStore = u"C:\\2000lumora\\pratim.txt"_s;
+    const DrivePath customerStore = u"C:\\2000lumora\\pratim.txt"_path;
     Deployment deployment;
 };
 

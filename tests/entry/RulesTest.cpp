@@ -4,7 +4,7 @@
 #include "entry/details/TimeOfJob.h"
 #include "entry/details/VolumeMark.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "support/TestPlatform.h"
@@ -44,11 +44,11 @@ TEST(TimeOfJobTest, HasDayCodeAndVolumeInFixedPlaces) {
 
 TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
     FixedVolume volume;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_s)), u"1234");
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_path)), u"1234");
     volume.number = -12;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_s)), u"-12");
+    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_path)), u"-12");
     volume.fails = true;
-    EXPECT_FALSE(ReadVolumeSerial(volume, u"C:\\"_s).ok());
+    EXPECT_FALSE(ReadVolumeSerial(volume, u"C:\\"_path).ok());
 }
 
 TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
@@ -110,7 +110,7 @@ protected:
         EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace().ok());
     }
     void put(const QString& name, const QByteArray& bytes) {
-        ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\"_s + name, bytes).ok());
+        ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_path / name, bytes).ok());
     }
 
     TestPlatform machine;
@@ -121,7 +121,7 @@ protected:
 TEST_F(DetailStoreTest, KeepsNameAndTelephoneInFiveLines) {
     EXPECT_FALSE(*store.details());
     ASSERT_TRUE(store.SaveDetails({u"דנה \"לוי"_s, u"03-1"_s}).ok());
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim.txt"_s),
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim.txt"_path),
               "0\r\n\"\xE3\xF0\xE4 \"\xEC\xE5\xE9\"\r\n\"03-1\"\r\n0\r\n0\r\n");
     const auto read = store.details();
     ASSERT_TRUE(read.ok() && *read);
@@ -159,7 +159,7 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
 
 TEST_F(DetailStoreTest, AnAlbumFieldThatIsMissingMovesTheOthersUp) {
     ASSERT_TRUE(store.SaveAlbumDetails({u"Studio"_s, QString(), u"x"_s}).ok());
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim2.txt"_s), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim2.txt"_path), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
     const auto read = store.albumDetails();
     ASSERT_TRUE(read.ok() && *read);
     EXPECT_EQ((*read)->name, u"Studio");

@@ -1,6 +1,6 @@
 #include "DetailsPageTest.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "session/Workspace.h"
 
 namespace lumora {
@@ -42,8 +42,8 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
     EXPECT_EQ(state.transfer.HazmanaP, 0);
     EXPECT_EQ(state.transfer.Mefurak, Travel::Whole);
-    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\tempred"_s));
-    EXPECT_FALSE(machine.files.folderExists(u"C:\\vedron"_s)) << "made before the pictures";
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\tempred"_path));
+    EXPECT_FALSE(machine.files.folderExists(u"C:\\vedron"_path)) << "made before the pictures";
 
     page.Text2_Change(u" Dana Levi"_s);
     page.Text3_Change(u"03-1234567"_s);
@@ -77,8 +77,8 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_EQ(state.shemot.Bord, u"BB1");
     EXPECT_EQ(state.shemot.maat, u"מט");
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_TRUE(machine.files.folderExists(u"C:\\vedron"_s));
-    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_s));
+    EXPECT_TRUE(machine.files.folderExists(u"C:\\vedron"_path));
+    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_path));
     EXPECT_TRUE(machine.files.fileExists(customerStore));
 }
 
@@ -216,7 +216,7 @@ TEST_F(nnnTest, ForgetsTheDetailsOfACustomerWhoDidNotAskToBeRemembered) {
 }
 
 TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_path, "in the way").ok());
     nnn& page = start();
     page.Image1_Click(0);
     EXPECT_EQ(page.step(), nnn::Step::Menu);
@@ -225,7 +225,7 @@ TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
 }
 
 TEST_F(nnnTest, StaysWithAReasonWhenTheCounterFolderCannotBeMade) {
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\vedron"_s, "in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\vedron"_path, "in the way").ok());
     nnn& page = atTerms(0);
     page.Check1_Click(true);
     page.Command3_Click();
@@ -233,7 +233,7 @@ TEST_F(nnnTest, StaysWithAReasonWhenTheCounterFolderCannotBeMade) {
     EXPECT_EQ(page.step(), nnn::Step::Terms);
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_TRUE(machine.dialogs.messages[0].contains(u"vedron"));
-    ASSERT_TRUE(machine.files.removeFile(u"C:\\vedron"_s).ok());
+    ASSERT_TRUE(machine.files.removeFile(u"C:\\vedron"_path).ok());
     page.Command3_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
 }
@@ -254,7 +254,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     EXPECT_EQ(page->controls().Combo1.text, u"More Sizes");
     page->Image1_Click(4);
     EXPECT_EQ(state.Optint, OrderKind::Mail);
-    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_s));
+    EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_path));
     EXPECT_EQ(chain.front()->id(), PageId::MoogMeret);
     EXPECT_EQ(chain.find(PageId::nnn), nullptr);
     chain.unload(PageId::MoogMeret);
@@ -284,11 +284,11 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAsked) {
     const nnnControls& shown = page.controls();
     page.Image1_Click(0);
     page.Command2_Click();
-    const QString order = u"C:\\2000lumora\\!!000\\order"_s;
-    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\!!000"_s).ok());
+    const DrivePath order = u"C:\\2000lumora\\!!000\\order"_path;
+    ASSERT_TRUE(machine.files.makeFolder(u"C:\\2000lumora\\!!000"_path).ok());
     ASSERT_TRUE(machine.files.makeFolder(order).ok());
     for (const char* name : {"!1.jpp", "a.jpp", "order.txt"})
-        ASSERT_TRUE(machine.files.writeWhole(order + u'\\' + QString::fromLatin1(name), "x").ok());
+        ASSERT_TRUE(machine.files.writeWhole(order / QString::fromLatin1(name), "x").ok());
     page.Command14_Click();
     EXPECT_TRUE(shown.Frame1.visible && shown.Command7.visible);
     page.Command7_Click();
@@ -319,7 +319,7 @@ TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
 TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
     nnn& page = start();
     page.Image1_Click(1);
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\pratim3.txt"_s, "0\r\n").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\pratim3.txt"_path, "0\r\n").ok());
     page.QuickCheck();
     EXPECT_EQ(machine.dialogs.messages, QStringList({"אחד או יותר מהפרטים חסרים בדוק שוב בבקשה"}));
     page.Text2_Change(u" Dana "_s);
@@ -327,7 +327,7 @@ TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(state.shemot.n1 + state.shemot.n2, u"DanaDana");
     EXPECT_EQ(state.shemot.ppr + state.shemot.maat + state.shemot.Bord + state.shemot.FillFit, u"10/15מבריקNBFIT");
-    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\pratim3.txt"_s));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\pratim3.txt"_path));
 }
 
 } // namespace

@@ -27,24 +27,24 @@ struct Mod4splitTest : ::testing::Test {
 
     Mod4splitTest() {
         for (const char* folder : {"C:\\order", "C:\\order\\meforakim"})
-            (void)test.files.makeFolder(QString::fromLatin1(folder));
+            (void)test.files.makeFolder(DrivePath(QString::fromLatin1(folder)));
     }
-    static QString source() { return u"C:\\order\\02a.jpp"_s; }
-    static QString piece(const char* numbers) {
-        return u"C:\\order\\meforakim\\02a_jpp_%1.prk"_s.arg(QLatin1StringView(numbers));
+    static DrivePath source() { return u"C:\\order\\02a.jpp"_path; }
+    static DrivePath piece(const char* numbers) {
+        return u"C:\\order\\meforakim"_path / u"02a_jpp_%1.prk"_s.arg(QLatin1StringView(numbers));
     }
-    static QString whole() { return u"C:\\order\\meforakim\\moorkavim\\02a.jpp"_s; }
-    void write(const QString& path, const QByteArray& bytes) {
-        ASSERT_TRUE(test.files.writeWhole(path, bytes).ok()) << path.toStdString();
+    static DrivePath whole() { return u"C:\\order\\meforakim\\moorkavim\\02a.jpp"_path; }
+    void write(const DrivePath& path, const QByteArray& bytes) {
+        ASSERT_TRUE(test.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
     }
     Cut cut(const QString& segment) {
         return pieces.SplitFile(source(), segment, Mod4split::Target::Meforakim, u"jpp"_s);
     }
-    QByteArray read(const QString& path) const {
+    QByteArray read(const DrivePath& path) const {
         const auto bytes = test.files.read(path);
         return bytes ? *bytes : QByteArrayLiteral("can't be read");
     }
-    QStringList cutNames() const { return test.files.names(u"C:\\order\\meforakim"_s, {u'*'}); }
+    QStringList cutNames() const { return test.files.names(u"C:\\order\\meforakim"_path, {u'*'}); }
 };
 
 // Each length up to three segments, and a file of 105 pieces that no buffer holds whole.
@@ -54,7 +54,7 @@ TEST_F(Mod4splitTest, CuttingAndJoiningGivesTheSameBytesForEveryLength) {
             length = 40 << 20;
         const qsizetype segment = length > 22 ? 400000 : 7;
         SCOPED_TRACE(length);
-        std::filesystem::remove_all(*test.drives.toHost(u"C:\\order\\meforakim"_s));
+        std::filesystem::remove_all(*test.drives.toHost(u"C:\\order\\meforakim"_path));
         const QByteArray bytes = bytesOf(length);
         write(source(), bytes);
         const Cut made = cut(QString::number(segment));
@@ -65,7 +65,7 @@ TEST_F(Mod4splitTest, CuttingAndJoiningGivesTheSameBytesForEveryLength) {
         EXPECT_TRUE(read(source()) == bytes);
         if (length == 0)
             continue;
-        const Joined joined = pieces.MergeFamily(made.folder + u'\\' + cutNames().first());
+        const Joined joined = pieces.MergeFamily(made.folder / cutNames().first());
         ASSERT_FALSE(joined.failure);
         EXPECT_EQ(joined.file, whole());
         EXPECT_EQ(joined.bytes, length);
@@ -74,7 +74,7 @@ TEST_F(Mod4splitTest, CuttingAndJoiningGivesTheSameBytesForEveryLength) {
 }
 
 TEST_F(Mod4splitTest, AnOldPieceKeepsItsTailAndAnOldJoinedFileDoesNot) {
-    ASSERT_TRUE(test.files.makeFolder(u"C:\\order\\meforakim\\moorkavim"_s).ok());
+    ASSERT_TRUE(test.files.makeFolder(u"C:\\order\\meforakim\\moorkavim"_path).ok());
     write(piece("002_002"), "0123456789");
     write(whole(), QByteArray(100, 'o'));
     write(source(), "abcdefg");
@@ -106,7 +106,7 @@ TEST_F(Mod4splitTest, AStopLeavesWholePiecesAndNoJoinedFile) {
     ASSERT_FALSE(cut(u"10"_s).failure);
     EXPECT_TRUE(stopped.MergeFamily(piece("001_011")).stopped);
     EXPECT_FALSE(test.files.fileExists(whole()));
-    EXPECT_EQ(test.files.collect(u"C:\\order"_s, Files::Depth::WithSubfolders).size(), 11);
+    EXPECT_EQ(test.files.collect(u"C:\\order"_path, Files::Depth::WithSubfolders).size(), 11);
 }
 
 TEST_F(Mod4splitTest, WhatCanNotBeCutIsRefusedAndNothingIsTouched) {
@@ -131,7 +131,7 @@ TEST_F(Mod4splitTest, WhatCanNotBeCutIsRefusedAndNothingIsTouched) {
                  {"10", "Q:\\02a.jpp", Failure::Kind::NotFound}};
     for (const auto& c : cases) {
         SCOPED_TRACE(c.segment);
-        const QString path = c.path ? QString::fromLatin1(c.path) : source();
+        const DrivePath path = c.path ? DrivePath(QString::fromLatin1(c.path)) : source();
         const Cut made = pieces.SplitFile(path, QString::fromLatin1(c.segment), Mod4split::Target::Meforakim, u"jpp"_s);
         ASSERT_TRUE(made.failure);
         EXPECT_EQ(made.failure->kind, c.kind) << made.failure->message.toStdString();
@@ -142,38 +142,38 @@ TEST_F(Mod4splitTest, WhatCanNotBeCutIsRefusedAndNothingIsTouched) {
     EXPECT_FALSE(cut(u" 2147483647 "_s).failure);
     EXPECT_EQ(cutNames(), QStringList(u"02a_jpp_001_001.prk"_s));
 
-    const QString longName = u"C:\\order\\"_s + QString(245, u'n') + u".jpp"_s;
+    const DrivePath longName = u"C:\\order"_path / (QString(245, u'n') + u".jpp"_s);
     write(longName, bytes);
     EXPECT_TRUE(pieces.SplitFile(longName, u"10"_s, Mod4split::Target::Meforakim, u"jpp"_s).failure);
     EXPECT_TRUE(pieces.SplitFile(source(), QString(), Mod4split::Target::Meforakim, u"prk"_s).passedOver);
 }
 
 TEST_F(Mod4splitTest, WhatCanNotBeJoinedIsRefusedAndLeavesNoFolder) {
-    write(u"C:\\order\\a.prk"_s, "x");
-    write(u"C:\\order\\_001_001.prk"_s, "x");
-    write(u"C:\\order\\holiday pictures.prk"_s, "x");
+    write(u"C:\\order\\a.prk"_path, "x");
+    write(u"C:\\order\\_001_001.prk"_path, "x");
+    write(u"C:\\order\\holiday pictures.prk"_path, "x");
     for (const char* name : {"a.prk", "_001_001.prk", "holiday pictures.prk", "gone_jpp_001_001.prk"}) {
-        const Joined joined = pieces.MergeFamily(u"C:\\order\\"_s + QString::fromLatin1(name));
+        const Joined joined = pieces.MergeFamily(u"C:\\order"_path / QString::fromLatin1(name));
         ASSERT_TRUE(joined.failure) << name;
         EXPECT_TRUE(joined.failure->message.contains(u"C:\\order\\"_s)) << name;
-        EXPECT_EQ(joined.file, QString());
+        EXPECT_EQ(joined.file, DrivePath());
     }
-    EXPECT_FALSE(test.files.folderExists(u"C:\\order\\moorkavim"_s));
+    EXPECT_FALSE(test.files.folderExists(u"C:\\order\\moorkavim"_path));
     // Fewer than 4 characters before the tail leave the base empty.
-    write(u"C:\\order\\jpp_001_001.prk"_s, "x");
-    EXPECT_EQ(pieces.MergeFamily(u"C:\\order\\jpp_001_001.prk"_s).file, u"C:\\order\\moorkavim\\.jpp"_s);
+    write(u"C:\\order\\jpp_001_001.prk"_path, "x");
+    EXPECT_EQ(pieces.MergeFamily(u"C:\\order\\jpp_001_001.prk"_path).file, u"C:\\order\\moorkavim\\.jpp"_path);
 }
 
 TEST_F(Mod4splitTest, AFullDiskLeavesWholePiecesAndTheOldJoinedFile) {
     const SmallDisk disk(64);
     if (!disk.available())
         GTEST_SKIP() << "no right to mount a disk";
-    std::filesystem::create_directory_symlink(disk.path(), *test.drives.toHost(u"C:\\small"_s));
-    const QString small = u"C:\\small\\02a.jpp"_s;
+    std::filesystem::create_directory_symlink(disk.path(), *test.drives.toHost(u"C:\\small"_path));
+    const DrivePath small = u"C:\\small\\02a.jpp"_path;
     const QByteArray bytes = bytesOf(40000);
     write(small, bytes);
-    const QString older = u"C:\\small\\moorkavim\\02a.jpp"_s;
-    ASSERT_TRUE(test.files.makeFolder(u"C:\\small\\moorkavim"_s).ok());
+    const DrivePath older = u"C:\\small\\moorkavim\\02a.jpp"_path;
+    ASSERT_TRUE(test.files.makeFolder(u"C:\\small\\moorkavim"_path).ok());
     write(older, "the older one");
     const auto leaves = [&] {
         QStringList names;
@@ -191,12 +191,12 @@ TEST_F(Mod4splitTest, AFullDiskLeavesWholePiecesAndTheOldJoinedFile) {
     EXPECT_EQ(leaves(), (QStringList{u"02a.jpp"_s, u"02a.jpp"_s, u"02a_jpp_001_006.prk"_s, u"02a_jpp_002_006.prk"_s}));
     EXPECT_EQ(read(small), bytes);
 
-    const Joined joined = pieces.MergeFamily(u"C:\\small\\02a_jpp_001_006.prk"_s);
+    const Joined joined = pieces.MergeFamily(u"C:\\small\\02a_jpp_001_006.prk"_path);
     ASSERT_TRUE(joined.failure);
     EXPECT_EQ(joined.failure->kind, Failure::Kind::NoSpace);
     EXPECT_EQ(leaves().size(), 4) << "no half file:" << leaves().join(u' ').toStdString();
     EXPECT_EQ(read(older), "the older one");
-    EXPECT_EQ(read(u"C:\\small\\02a_jpp_001_006.prk"_s), bytes.left(8000));
+    EXPECT_EQ(read(u"C:\\small\\02a_jpp_001_006.prk"_path), bytes.left(8000));
 }
 
 TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {

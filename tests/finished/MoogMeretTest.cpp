@@ -36,15 +36,15 @@ protected:
     static QString in(const QString& order, const QString& leaf) { return orders + u'\\' + order + u'\\' + leaf; }
 
     FinishedOrders() {
-        state.DiskRoot = u"C:\\"_s;
+        state.DiskRoot = u"C:\\"_path;
         state.shemot.n1 = u"***"_s;
         for (const QString& folder : {u"C:\\2000lumora"_s, orders, orders + u'\\' + whole, orders + u'\\' + pieces})
-            EXPECT_TRUE(test.files.makeFolder(folder).ok());
+            EXPECT_TRUE(test.files.makeFolder(DrivePath(folder)).ok());
         for (const char* leaf : {"!104_1234.jpp", "02a.jpp", "11b.JPG", "x.txt"})
             write(whole, QString::fromLatin1(leaf));
         ListOutput log;
         log.pair(u"Shemot.n1"_s, u"דנה לוי"_s).pair(u"Shemot.n2"_s, u"03-1234567"_s).pair(u"Shemot.ppr"_s, u"10/15"_s);
-        EXPECT_TRUE(test.files.writeWhole(in(whole, whole + u".txt"_s), log.bytes()).ok());
+        EXPECT_TRUE(test.files.writeWhole(DrivePath(in(whole, whole + u".txt"_s)), log.bytes()).ok());
         for (const char* leaf :
              {"!105_1234.jpp", "02a_jpp_001_002.prk", "02a_jpp_002_002.prk", "02a.jpp", "kashloo.txt", "z.jpg"})
             write(pieces, QString::fromLatin1(leaf));
@@ -56,7 +56,7 @@ protected:
     }
 
     void write(const QString& order, const QString& leaf) {
-        EXPECT_TRUE(test.files.writeWhole(in(order, leaf), leaf.toUtf8()).ok());
+        EXPECT_TRUE(test.files.writeWhole(DrivePath(in(order, leaf)), leaf.toUtf8()).ok());
     }
     MoogMeret& start() {
         chain.show(PageId::MoogMeret);
@@ -116,7 +116,7 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
     for (const Case& c : cases) {
         page.List3_Click(page.controls().List3.find(c.order));
         EXPECT_TRUE(page.controls().Picture2.visible);
-        EXPECT_EQ(state.transfer.OrderFolder, orders + u'\\' + c.order);
+        EXPECT_EQ(state.transfer.OrderFolder.text(), orders + u'\\' + c.order);
         EXPECT_EQ(marked(page), c.marked);
         EXPECT_EQ(page.controls().Label1.text, QString::number(c.files));
         EXPECT_EQ(page.controls().Label5.text, QString::number(c.pictures));
@@ -135,7 +135,7 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
 
 TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     const QString empty = u"2026_11_19_KUP_1234^103"_s;
-    ASSERT_TRUE(test.files.makeFolder(orders + u'\\' + empty).ok());
+    ASSERT_TRUE(test.files.makeFolder(DrivePath(orders + u'\\' + empty)).ok());
     MoogMeret& page = startWith(empty);
     EXPECT_EQ(page.controls().Label1.text, u"0");
     EXPECT_TRUE(page.controls().Label4Reka.visible);
@@ -148,7 +148,7 @@ TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     EXPECT_TRUE(page.controls().Command4.visible && page.controls().Command2.visible);
     EXPECT_EQ(chain.front(), &page);
 
-    std::filesystem::remove_all(*test.drives.toHost(orders));
+    std::filesystem::remove_all(*test.drives.toHost(DrivePath(orders)));
     page.List3_Click(1);
     EXPECT_TRUE(test.dialogs.messages.last().contains(page.controls().List2.item(1))) << "gone since it was listed";
     page.Command5_Click();
@@ -197,11 +197,11 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
     page.Command4_Click();
     EXPECT_EQ(chain.front()->id(), PageId::UploadForm);
     EXPECT_TRUE(state.handOver.lines.isEmpty()) << "that sender takes the folder whole";
-    EXPECT_EQ(state.transfer.OrderFolder, orders + u'\\' + pieces);
+    EXPECT_EQ(state.transfer.OrderFolder.text(), orders + u'\\' + pieces);
 }
 
 TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
-    state.transfer.OrderFolder = orders + u'\\' + whole;
+    state.transfer.OrderFolder = DrivePath(orders + u'\\' + whole);
     state.shemot.n1 = u"Dana"_s;
     state.handOver.lines = {in(whole, whole)};
     MoogMeret& page = start();
@@ -227,7 +227,7 @@ TEST_F(FinishedOrders, AskBeforeASecondRunOfTheProgramGoesOn) {
 }
 
 TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
-    const HostPath sheet = *test.drives.toHost(in(whole, u"!104_1234.jpp"_s));
+    const HostPath sheet = *test.drives.toHost(DrivePath(in(whole, u"!104_1234.jpp"_s)));
     struct Case {
         int width, height;
         int horizontal, vertical;
@@ -313,7 +313,7 @@ TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     page.Command2_Click();
     ASSERT_EQ(test.mail.messages.size(), 1) << "the first one at once";
     EXPECT_EQ(test.mail.messages[0].subject, whole);
-    EXPECT_EQ(test.mail.messages[0].attachment, *test.drives.toHost(in(whole, u"!104_1234.jpp"_s)));
+    EXPECT_EQ(test.mail.messages[0].attachment, *test.drives.toHost(DrivePath(in(whole, u"!104_1234.jpp"_s))));
     for (const char* word : {"דנה לוי", "03-1234567", "10/15", "!104_1234.jpp", "מנה 1 מתוך 3"})
         EXPECT_TRUE(test.mail.messages[0].body.contains(QString::fromUtf8(word))) << word;
     EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(0, false).trimmed());
@@ -324,7 +324,7 @@ TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     ASSERT_EQ(test.mail.messages.size(), 3);
     EXPECT_EQ(page.walk().fate(1), PackageWalk::Fate::Failed);
     EXPECT_TRUE(page.controls().Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
-    EXPECT_TRUE(test.files.fileExists(in(whole, u"02a.jpp"_s)));
+    EXPECT_TRUE(test.files.fileExists(DrivePath(in(whole, u"02a.jpp"_s))));
 
     test.mail.outcomes = {{MailEnd::RecipientRefused, {}}};
     page.List1_Click(0);
@@ -333,7 +333,7 @@ TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(14, false));
     page.List1_Click(1);
     EXPECT_EQ(test.mail.messages.size(), 5);
-    EXPECT_EQ(test.mail.messages.last().attachment, *test.drives.toHost(in(whole, u"02a.jpp"_s)));
+    EXPECT_EQ(test.mail.messages.last().attachment, *test.drives.toHost(DrivePath(in(whole, u"02a.jpp"_s))));
     EXPECT_EQ(page.controls().Label4Sof.text, u"כל 3 המנות נשלחו בדואר.");
 }
 

@@ -18,11 +18,11 @@ struct SpltFormTest : ::testing::Test, PageRig {
         chain.show(PageId::SpltForm);
     }
     SpltForm& page() { return static_cast<SpltForm&>(*chain.find(PageId::SpltForm)); }
-    static QString at(const char* leaf) { return u"C:\\order\\"_s + QString::fromLatin1(leaf); }
-    void write(const QString& path, const QByteArray& bytes) {
-        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.toStdString();
+    static DrivePath at(const char* leaf) { return u"C:\\order"_path / QString::fromLatin1(leaf); }
+    void write(const DrivePath& path, const QByteArray& bytes) {
+        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
     }
-    QByteArray read(const QString& path) const {
+    QByteArray read(const DrivePath& path) const {
         const auto bytes = machine.files.read(path);
         return bytes ? *bytes : QByteArrayLiteral("can't be read");
     }
@@ -40,13 +40,13 @@ TEST_F(SpltFormTest, AFolderIsCutAndItsFamiliesAreJoinedAgain) {
     EXPECT_EQ(page().controls().Text2.text, u"400000"_s);
     choose("order.txt", &SpltForm::Command2_Click);
     EXPECT_EQ(page().controls().List4files.items(),
-              QStringList({at("1.jpp"), at("2.jpp"), at("3.jpp"), at("order.txt")}));
+              QStringList({at("1.jpp").text(), at("2.jpp").text(), at("3.jpp").text(), at("order.txt").text()}));
     page().Text2_Change(u"4"_s);
     page().Command3_Click();
     EXPECT_EQ(page().phase(), SpltForm::Phase::Good);
     EXPECT_TRUE(page().controls().Label4Total.text.startsWith(u"Files cut: 3, pieces: 6."_s))
         << page().controls().Label4Total.text.toStdString();
-    EXPECT_EQ(page().controls().Label4Where.text, at("meforakim"));
+    EXPECT_EQ(page().controls().Label4Where.text, at("meforakim").text());
 
     choose("meforakim\\1_jpp_001_003.prk", &SpltForm::Command8_Click);
     EXPECT_TRUE(page().controls().List4files.isEmpty());
@@ -125,7 +125,7 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     ASSERT_TRUE(machine.files.removeFile(at("1.jpp")).ok());
     page().Command3_Click();
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("1.jpp")));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("1.jpp").text()));
     EXPECT_EQ(page().phase(), SpltForm::Phase::Failed);
     EXPECT_EQ(read(at("meforakim\\2_jpp_002_002.prk")), "e");
 
@@ -146,14 +146,14 @@ TEST_F(SpltFormTest, EachTroubleIsToldOnceAndTheRestGoesOn) {
     machine.dialogs.messages.clear();
     choose("gone\\1_jpp_001_001.prk", &SpltForm::Command8_Click);
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("gone")));
+    EXPECT_TRUE(machine.dialogs.messages[0].contains(at("gone").text()));
 
     machine.dialogs.messages.clear();
     for (const char* leaf : {"7.jpp", "8.jpp", "9.jpp"})
         write(at(leaf), "gone before it is cut");
     choose("7.jpp", &SpltForm::Command2_Click);
     for (const QString& path : page().controls().List4files.items())
-        (void)machine.files.removeFile(path);
+        (void)machine.files.removeFile(DrivePath(path));
     page().Command3_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 1) << "one box for all of them";
     choose("7_jpp_001_001.prk", &SpltForm::Command9_Click);

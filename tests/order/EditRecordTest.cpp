@@ -1,6 +1,7 @@
 #include "order/EditRecord.h"
 #include "common/FixedText.h"
 #include "session/SessionState.h"
+#include "support/DrivePathLiteral.h"
 
 #include <gtest/gtest.h>
 
@@ -57,7 +58,7 @@ TEST(EditRecord, CutsWhatIsTooLongForItsField) {
 
 TEST(EditRecord, UnpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EditFields fields;
-    fields.PicturePath = u"C:\\pics\\תמונה.jpg"_s;
+    fields.PicturePath = u"C:\\pics\\תמונה.jpg"_path;
     UnpackEditState(EditRecord::newPicture(), fields);
     EXPECT_EQ(fields.GainB, 1.0F);
     EXPECT_EQ(fields.RotationCode, 180);
@@ -65,7 +66,7 @@ TEST(EditRecord, UnpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EXPECT_EQ(fields.AutoMarker, u"000");
     EXPECT_EQ(fields.TextFontSize, 8);
     EXPECT_EQ(fields.EditState.size(), 200);
-    EXPECT_EQ(fields.PicturePath, u"C:\\pics\\תמונה.jpg");
+    EXPECT_EQ(fields.PicturePath, u"C:\\pics\\תמונה.jpg"_path);
 
     // One character of its own at the start of each field shows that no column is shifted.
     const QString record = u"1.290.5 0.02170210-99 12  1  2  034R11RED111kids      242 7 8 1 ddd       "_s +

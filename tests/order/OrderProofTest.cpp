@@ -126,11 +126,11 @@ TEST(LineEnds, tellAServerThatChangesFilesFromOneThatCutsThem) {
 
     TestPlatform test;
     const QByteArray large = QByteArray(65535, 'x') + "\r\n\r";
-    ASSERT_TRUE(test.files.writeWhole(u"C:\\large"_s, large));
-    const Result<LineEnds> read = LineEndsOf(test.files, u"C:\\large"_s);
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\large"_path, large));
+    const Result<LineEnds> read = LineEndsOf(test.files, u"C:\\large"_path);
     ASSERT_TRUE(read);
     EXPECT_TRUE(read->cr == 2 && read->lf == 1 && read->crlf == 1);
-    EXPECT_FALSE(LineEndsOf(test.files, u"C:\\none"_s));
+    EXPECT_FALSE(LineEndsOf(test.files, u"C:\\none"_path));
 }
 
 // An order of so many pictures, of which some failed and one has a name that no print file can have.
@@ -229,7 +229,7 @@ TEST(AFamilyOfPieces, isWholeWithoutAGapAndWithAllThatItsNameDeclaresLessOne) {
 
 TEST(AnOrder, isReadFromItsFolder) {
     TestPlatform test;
-    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_s);
+    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_path);
     ASSERT_TRUE(test.files.makeFolder(folder.path()));
     ASSERT_TRUE(test.files.writeWhole(folder.filePath(printName(0)), "x"));
     EXPECT_EQ(OrderCompleteness::read(test.files, folder, {printName(0)}).named, std::nullopt);
@@ -243,7 +243,7 @@ TEST(AnOrder, isReadFromItsFolder) {
 TEST(AnOrderNumber, belongsToTheFirstThatMakesItsFolder) {
     TestPlatform test;
     SessionState one = exampleOrder();
-    one.DiskRoot = u"C:\\"_s;
+    one.DiskRoot = u"C:\\"_path;
     SessionState two = one;
     const Result<OrderFolder> first = claimOrderFolder(one, test.files, OrderFolder::Ending::Plain);
     const Result<OrderFolder> second = claimOrderFolder(two, test.files, OrderFolder::Ending::BySession);
@@ -252,16 +252,16 @@ TEST(AnOrderNumber, belongsToTheFirstThatMakesItsFolder) {
     EXPECT_NE(first->path(), second->path());
 
     // An unfinished order of yesterday, in pieces, has the next number; a finished one of yesterday has none to keep.
-    const QString orders = u"C:\\2000lumora\\!!000\\"_s;
-    ASSERT_TRUE(test.files.makeFolder(orders + u"2026_11_20_KUP_1234^107P"_s));
-    const OrderFolder finished(orders + u"2026_11_20_KUP_1234^108"_s);
+    const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
+    ASSERT_TRUE(test.files.makeFolder(orders / u"2026_11_20_KUP_1234^107P"));
+    const OrderFolder finished(orders / u"2026_11_20_KUP_1234^108");
     ASSERT_TRUE(test.files.makeFolder(finished.path()));
     ASSERT_TRUE(test.files.writeWhole(finished.logPath(), "x"));
     ASSERT_TRUE(claimOrderFolder(one, test.files, OrderFolder::Ending::Plain));
     EXPECT_EQ(one.MisparHazmana, u"108"_s);
 
-    ASSERT_TRUE(test.files.writeWhole(u"C:\\blocked"_s, "x"));
-    one.DiskRoot = u"C:\\blocked\\"_s;
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\blocked"_path, "x"));
+    one.DiskRoot = u"C:\\blocked\\"_path;
     EXPECT_FALSE(claimOrderFolder(one, test.files, OrderFolder::Ending::Plain));
     EXPECT_EQ(one.MisparHazmana, u"108"_s);
 }

@@ -110,7 +110,7 @@ TEST(AnOrderState, keepsTheKeysOfALaterVersion) {
 
 TEST(AnOrderState, liesHiddenInItsFolderAndIsMissedWhereThereIsNone) {
     TestPlatform test;
-    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_s);
+    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_path);
     EXPECT_FALSE(WriteOrderState(test.files, folder, unfinished())) << "no folder";
     ASSERT_TRUE(test.files.makeFolder(folder.path()));
     EXPECT_EQ(ReadOrderState(test.files, folder).failure().kind, Failure::Kind::NotFound);

@@ -56,7 +56,7 @@ TEST(OrderReport, KnowsThePaperKindsOfBothLanguages) {
 
 TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
     TestPlatform test;
-    const QString path = u"C:\\log.txt"_s;
+    const DrivePath path = u"C:\\log.txt"_path;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"Shemot.n1\",\"a, \"b\" c\"\r\n\"Shemot.TotalPics\",13\r\n"
                                       "\"Shemot.n3\",\"elsewhere\"\r\n\"Shemot.Hearot\",\"\"\r\nrubbish\r\n");
     OrderDetails details;
@@ -73,7 +73,7 @@ TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
 
 TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAgain) {
     TestPlatform test;
-    const QString path = u"C:\\log.txt"_s;
+    const DrivePath path = u"C:\\log.txt"_path;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
                                       "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
     OrderDetails details; // a new album has no customer, and the address may have been mended since
@@ -95,7 +95,7 @@ TEST(ReadOrderDetails, SaysSoWhenThereIsNoLog) {
     TestPlatform test;
     OrderDetails details;
     details.TotalPics = 4;
-    ReadOrderDetails(test.files, u"C:\\none.txt"_s, details);
+    ReadOrderDetails(test.files, u"C:\\none.txt"_path, details);
     for (const QString& text : {details.n1, details.n2, details.ppr, details.Hearot, details.Mail, details.FillFit,
                                 details.maat, details.Bord})
         EXPECT_EQ(text, u"NO details"_s);
@@ -107,13 +107,13 @@ TEST(BrokenFiles, ComeBackAsTheyWereWritten) {
     TextList broken;
     broken.append(u"C:\\תמונות\\a.jpp"_s);
     broken.append(u"C:\\b.jpp"_s);
-    ASSERT_TRUE(WriteBrokenFiles(test.files, OrderFolder(u"C:"_s), broken));
-    EXPECT_EQ(*test.files.read(u"C:\\kashloo.txt"_s), "C:\\\xFA\xEE\xE5\xF0\xE5\xFA\\a.jpp\r\nC:\\b.jpp\r\n");
-    EXPECT_EQ(ReadBrokenFiles(test.files, OrderFolder(u"C:\\"_s)), broken.items());
+    ASSERT_TRUE(WriteBrokenFiles(test.files, OrderFolder(u"C:"_path), broken));
+    EXPECT_EQ(*test.files.read(u"C:\\kashloo.txt"_path), "C:\\\xFA\xEE\xE5\xF0\xE5\xFA\\a.jpp\r\nC:\\b.jpp\r\n");
+    EXPECT_EQ(ReadBrokenFiles(test.files, OrderFolder(u"C:\\"_path)), broken.items());
     EXPECT_TRUE(IsBroken(broken, u"b.jpp"_s));
     EXPECT_FALSE(IsBroken(broken, u"B.jpp"_s));
-    EXPECT_TRUE(ReadBrokenFiles(test.files, OrderFolder(u"C:\\none"_s)).isEmpty());
-    const auto written = WriteBrokenFiles(test.files, OrderFolder(u"C:\\none"_s), broken);
+    EXPECT_TRUE(ReadBrokenFiles(test.files, OrderFolder(u"C:\\none"_path)).isEmpty());
+    const auto written = WriteBrokenFiles(test.files, OrderFolder(u"C:\\none"_path), broken);
     ASSERT_FALSE(written);
     EXPECT_TRUE(written.failure().message.contains(u"kashloo.txt"_s));
 }

@@ -47,13 +47,13 @@ TEST(ASizeField, hasTheEndsOfThePaperAndIsBlankForASpecialSize) {
 }
 
 TEST(ABasketLine, splitsIntoWhatItWasComposedOfInBothForms) {
-    const BasketLine line{u"7 1318GNB"_s, EditRecord::newPicture(), path};
+    const BasketLine line{u"7 1318GNB"_s, EditRecord::newPicture(), DrivePath(path)};
     EXPECT_EQ(line.compose(LineForm::Short), u"7 1318GNB"_s + path);
     const QString full = line.compose(LineForm::Full);
     EXPECT_EQ(full.size(), 209 + path.size());
     const BasketLine back = BasketLine::split(full, LineForm::Full);
     EXPECT_EQ(back.code, line.code);
-    EXPECT_EQ(back.path, path);
+    EXPECT_EQ(back.path.text(), path);
     EXPECT_EQ(back.editState, EditRecord::newPicture());
     EXPECT_EQ(BasketLine::withCopies(full, 12), u"121318GNB"_s + full.mid(9));
 }

@@ -2,6 +2,7 @@
 
 #include "order/OrderTail.h"
 #include "order/PrintFileName.h"
+#include "support/DrivePathLiteral.h"
 #include "support/ExampleOrder.h"
 
 #include <gtest/gtest.h>
@@ -122,7 +123,7 @@ TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {
 }
 
 TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
-    const QString base = PrintBaseName(u"C:\\pics\\תמונה 01.jpg"_s);
+    const QString base = PrintBaseName(u"C:\\pics\\תמונה 01.jpg"_path);
     const PrintFileName name{u"121015MWB"_s, 7, 3, base};
     EXPECT_EQ(name.text(), u"121015MWB0007_03FAEEE5F0E4203031.jpp"_s);
     const std::optional<PrintFileName> read = PrintFileName::parse(name.text());
@@ -134,7 +135,7 @@ TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
     EXPECT_EQ(read->copies(), 12);
 
     EXPECT_EQ((PrintFileName{u"1 1015GNB"_s, 12345, 10, u"a"_s}.text()), u"1 1015GNB2345_1061.jpp"_s);
-    EXPECT_EQ(PrintBaseName(u"C:\\p\\0123456789012345678901234.jpg"_s), u"56789012345678901234"_s);
+    EXPECT_EQ(PrintBaseName(u"C:\\p\\0123456789012345678901234.jpg"_path), u"56789012345678901234"_s);
     for (const char* other :
          {"!105_1234.jpp", "121015MWB007_0361.jpp", "121015MWB0007_036.jpp", "121015MWB0007_03.jpp", ""})
         EXPECT_FALSE(PrintFileName::parse(QString::fromLatin1(other))) << other;

@@ -1,5 +1,6 @@
 #include "platform/files/Drives.h"
 #include "common/AnsiCodePage.h"
+#include "support/DrivePathLiteral.h"
 
 #include <QTemporaryDir>
 
@@ -45,20 +46,20 @@ TEST_F(DrivesTest, MapsTheLettersBothWays) {
         {"Z:\\", "/"},
     };
     for (const auto& [drivePath, hostPath] : cases) {
-        const auto host = drives.toHost(QString::fromLatin1(drivePath));
+        const auto host = drives.toHost(DrivePath(QString::fromLatin1(drivePath)));
         ASSERT_TRUE(host) << drivePath;
         EXPECT_EQ(host->lexically_normal(), hostPath) << drivePath;
-        EXPECT_EQ(drives.toDrive(hostPath).toStdString(), drivePath);
+        EXPECT_EQ(drives.toDrive(hostPath).text().toStdString(), drivePath);
     }
-    EXPECT_EQ(drives.toHost(u"c:\\a//b\\.\\x\\..\\c"_s), data / "a" / "b" / "c");
-    EXPECT_EQ(drives.toDrive(data / "sub" / ".." / "x/"), u"C:\\x"_s);
+    EXPECT_EQ(drives.toHost(u"c:\\a//b\\.\\x\\..\\c"_path), data / "a" / "b" / "c");
+    EXPECT_EQ(drives.toDrive(data / "sub" / ".." / "x/"), u"C:\\x"_path);
 }
 
 TEST_F(DrivesTest, RefusesWhatIsNoPathOfADrive) {
     const Drives drives = make();
     for (const char* path : {"", "C", "***", "\\a", "E:\\a", "1:\\a", "C:\\..\\secret", "C:\\a\\..\\..\\secret"})
-        EXPECT_FALSE(drives.toHost(QString::fromLatin1(path))) << path;
-    EXPECT_FALSE(drives.toHost(u"C:\\a"_s + QChar(0) + u'b'));
+        EXPECT_FALSE(drives.toHost(DrivePath(QString::fromLatin1(path)))) << path;
+    EXPECT_FALSE(drives.toHost(DrivePath(u"C:\\a"_s + QChar(0) + u'b')));
 }
 
 TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
@@ -66,22 +67,22 @@ TEST_F(DrivesTest, GivesTheLetterOfACardToNoOther) {
     insertCard("TWO");
     fs::create_directories(media / "cdrom"); // a place without a medium
     Drives drives = make(u'E');
-    EXPECT_EQ(drives.programRoot(), u"E:\\"_s);
-    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_s);
-    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_s); // E: is the program's own
+    EXPECT_EQ(drives.programRoot(), u"E:\\"_path);
+    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_path);
+    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_path); // E: is the program's own
 
     fs::remove_all(media / "ONE");
     drives.refreshMedia();
     EXPECT_EQ(drives.drives().size(), 3U);
-    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_s);
+    EXPECT_EQ(drives.toDrive(media / "TWO"), u"F:\\"_path);
 
     insertCard("THREE");
     drives.refreshMedia();
-    EXPECT_EQ(drives.toDrive(media / "THREE"), u"G:\\"_s);
+    EXPECT_EQ(drives.toDrive(media / "THREE"), u"G:\\"_path);
     EXPECT_EQ(drives.drives().size(), 4U);
     insertCard("ONE");
     drives.refreshMedia();
-    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_s);
+    EXPECT_EQ(drives.toDrive(media / "ONE"), u"D:\\"_path);
 }
 
 TEST_F(DrivesTest, OffersTheDrivesThatTheLabPutsFirstBeforeTheOthers) {
@@ -92,7 +93,7 @@ TEST_F(DrivesTest, OffersTheDrivesThatTheLabPutsFirstBeforeTheOthers) {
     for (const Drives::Drive& drive : drives.drives())
         letters += drive.letter;
     EXPECT_EQ(letters, u"ZECD");
-    EXPECT_EQ(drives.toDrive(media / "TWO" / "a.jpg"), u"E:\\a.jpg"_s);
+    EXPECT_EQ(drives.toDrive(media / "TWO" / "a.jpg"), u"E:\\a.jpg"_path);
 }
 
 TEST_F(DrivesTest, CountsAMediumThatShowsTwiceOnce) {
@@ -112,11 +113,11 @@ TEST_F(DrivesTest, CarriesNamesThatAreNoTextAndGivesTheirBytesBack) {
                       "bom"),
           std::string("\xed\xb2\x80"), std::string("\xf0\x9f\x98\x80"), std::string("\xf0\x9f\x98"),
           std::string("אב.jpg")}) {
-        const QString path = drives.toDrive(data / name);
+        const DrivePath path = drives.toDrive(data / name);
         EXPECT_EQ(drives.toHost(path)->native(), (data / name).native()) << name;
-        EXPECT_EQ(path.count(u'\\'), 1) << name;
+        EXPECT_EQ(path.text().count(u'\\'), 1) << name;
     }
-    EXPECT_EQ(AnsiCodePage::squeeze(drives.toDrive(data / "a\xff.jpg")), u"C:\\a?.jpg"_s);
+    EXPECT_EQ(AnsiCodePage::squeeze(drives.toDrive(data / "a\xff.jpg").text()), u"C:\\a?.jpg"_s);
 }
 
 TEST(ShortenedName, KeepsTheEndingAndTellsLongNamesApart) {

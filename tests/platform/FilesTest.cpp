@@ -1,6 +1,7 @@
 #include "platform/files/Files.h"
 
 #include "common/HostFile.h"
+#include "support/DrivePathLiteral.h"
 #include "support/SmallDisk.h"
 
 #include <QTemporaryDir>
@@ -56,65 +57,67 @@ TEST_F(FilesTest, ListsByPatternWithoutCaseAndSortsWithoutCase) {
         {"", ""},
     };
     for (const auto& [pattern, expected] : cases)
-        EXPECT_EQ(files.names(u"C:\\"_s, QString::fromLatin1(pattern)).join(u'|').toStdString(), expected) << pattern;
-    EXPECT_EQ(files.folders(u"C:\\"_s), QStringList(u"folder.jpg"_s));
-    EXPECT_TRUE(files.names(u"C:\\missing"_s, u"*"_s).isEmpty());
+        EXPECT_EQ(files.names(u"C:\\"_path, QString::fromLatin1(pattern)).join(u'|').toStdString(), expected)
+            << pattern;
+    EXPECT_EQ(files.folders(u"C:\\"_path), QStringList(u"folder.jpg"_s));
+    EXPECT_TRUE(files.names(u"C:\\missing"_path, u"*"_s).isEmpty());
 }
 
 TEST_F(FilesTest, ShowsAQuestionMarkForWhatTheCodePageLacksAndTakesItForAbsent) {
     put("漢.jpg");
     put("\xff.jpg");
-    EXPECT_EQ(files.names(u"C:\\"_s, u"*.jpg"_s), QStringList({u"?.jpg"_s, u"?.jpg"_s}));
+    EXPECT_EQ(files.names(u"C:\\"_path, u"*.jpg"_s), QStringList({u"?.jpg"_s, u"?.jpg"_s}));
     put("real?.jpg");
-    EXPECT_FALSE(files.fileExists(u"C:\\real?.jpg"_s));
-    EXPECT_EQ(files.read(u"C:\\real?.jpg"_s).failure().kind, Failure::Kind::NotFound);
-    EXPECT_FALSE(files.writeWhole(u"C:\\new?.jpg"_s, "x"));
+    EXPECT_FALSE(files.fileExists(u"C:\\real?.jpg"_path));
+    EXPECT_EQ(files.read(u"C:\\real?.jpg"_path).failure().kind, Failure::Kind::NotFound);
+    EXPECT_FALSE(files.writeWhole(u"C:\\new?.jpg"_path, "x"));
 }
 
 TEST_F(FilesTest, CollectsThroughSubfoldersAndEndsWhereALinkLeadsBack) {
     put("a/1.jpg");
     put("a/b/2.jpg");
     fs::create_directory_symlink(data, data / "a" / "b" / "loop");
-    EXPECT_EQ(files.collect(u"C:\\a\\"_s, Files::Depth::WithSubfolders).join(u'|'), u"C:\\a\\1.jpg|C:\\a\\b\\2.jpg"_s);
-    EXPECT_EQ(files.collect(u"C:\\a"_s, Files::Depth::ThisFolder).join(u'|'), u"C:\\a\\1.jpg"_s);
+    EXPECT_EQ(files.collect(u"C:\\a\\"_path, Files::Depth::WithSubfolders).join(u'|'),
+              u"C:\\a\\1.jpg|C:\\a\\b\\2.jpg"_s);
+    EXPECT_EQ(files.collect(u"C:\\a"_path, Files::Depth::ThisFolder).join(u'|'), u"C:\\a\\1.jpg"_s);
 }
 
 TEST_F(FilesTest, WritesReadsCopiesAndRemoves) {
     const QByteArray bytes("\r\n\0\xff mixed\n", 11);
-    const QString path = u"C:\\שם.txt"_s;
+    const DrivePath path = u"C:\\שם.txt"_path;
     ASSERT_TRUE(files.writeWhole(path, "old"));
     ASSERT_TRUE(files.writeWhole(path, bytes));
     EXPECT_EQ(files.read(path).value(), bytes);
     EXPECT_EQ(files.size(path).value(), bytes.size());
-    ASSERT_TRUE(files.copyFile(path, u"C:\\copy.txt"_s));
-    EXPECT_EQ(files.read(u"C:\\copy.txt"_s).value(), bytes);
+    ASSERT_TRUE(files.copyFile(path, u"C:\\copy.txt"_path));
+    EXPECT_EQ(files.read(u"C:\\copy.txt"_path).value(), bytes);
     ASSERT_TRUE(files.removeFile(path));
     EXPECT_FALSE(files.fileExists(path));
     EXPECT_EQ(countAll(data), 1);
 }
 
 TEST_F(FilesTest, MakesFoldersForTheirOwnerOnly) {
-    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_s));
-    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_s)); // again
+    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_path));
+    ASSERT_TRUE(files.makeFolder(u"C:\\2000lumora"_path)); // again
     struct stat status {};
     ASSERT_EQ(::stat((data / "2000lumora").c_str(), &status), 0);
     EXPECT_EQ(status.st_mode & 0777, 0700U);
-    EXPECT_EQ(files.makeFolder(u"C:\\no\\parent"_s).failure().kind, Failure::Kind::NotFound);
+    EXPECT_EQ(files.makeFolder(u"C:\\no\\parent"_path).failure().kind, Failure::Kind::NotFound);
     put("afile");
-    EXPECT_FALSE(files.makeFolder(u"C:\\afile"_s));
-    EXPECT_TRUE(*files.makeNewFolder(u"C:\\claimed"_s));
-    EXPECT_FALSE(*files.makeNewFolder(u"C:\\claimed"_s));
-    EXPECT_FALSE(files.makeNewFolder(u"C:\\no\\parent"_s).ok());
+    EXPECT_FALSE(files.makeFolder(u"C:\\afile"_path));
+    EXPECT_TRUE(*files.makeNewFolder(u"C:\\claimed"_path));
+    EXPECT_FALSE(*files.makeNewFolder(u"C:\\claimed"_path));
+    EXPECT_FALSE(files.makeNewFolder(u"C:\\no\\parent"_path).ok());
 }
 
 TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
-    const QString path = u"C:\\"_s + QString(200, QChar(0x05D0)) + u".jpg"_s;
+    const DrivePath path = u"C:\\"_path / (QString(200, QChar(0x05D0)) + u".jpg"_s);
     ASSERT_TRUE(files.writeWhole(path, "view"));
     EXPECT_TRUE(files.fileExists(path));
     EXPECT_EQ(files.read(path).value(), "view");
-    const QStringList listed = files.names(u"C:\\"_s, u"*.jpg"_s);
+    const QStringList listed = files.names(u"C:\\"_path, u"*.jpg"_s);
     ASSERT_EQ(listed.size(), 1);
-    EXPECT_TRUE(files.removeFile(u"C:\\"_s + listed[0]));
+    EXPECT_TRUE(files.removeFile(u"C:\\"_path / listed[0]));
 }
 
 TEST_F(FilesTest, NeverListsWhatIsHiddenAndTakesWhatAKillLeftAtTheNextStart) {
@@ -126,9 +129,9 @@ TEST_F(FilesTest, NeverListsWhatIsHiddenAndTakesWhatAKillLeftAtTheNextStart) {
         put(name);
     fs::create_directory(data / "order" / ".kept");
     put("order/.kept/one.bmp");
-    EXPECT_EQ(files.names(u"C:\\order"_s, u"*.*"_s), QStringList({u"a.jpp"_s, u"lumora-1-1.tmp"_s}));
-    EXPECT_EQ(files.folders(u"C:\\order"_s), QStringList(u"deep"_s));
-    EXPECT_EQ(files.collect(u"C:\\order"_s, Files::Depth::WithSubfolders),
+    EXPECT_EQ(files.names(u"C:\\order"_path, u"*.*"_s), QStringList({u"a.jpp"_s, u"lumora-1-1.tmp"_s}));
+    EXPECT_EQ(files.folders(u"C:\\order"_path), QStringList(u"deep"_s));
+    EXPECT_EQ(files.collect(u"C:\\order"_path, Files::Depth::WithSubfolders),
               QStringList({u"C:\\order\\a.jpp"_s, u"C:\\order\\lumora-1-1.tmp"_s}));
 
     const auto now = fs::file_time_type::clock::now();
@@ -141,17 +144,17 @@ TEST_F(FilesTest, NeverListsWhatIsHiddenAndTakesWhatAKillLeftAtTheNextStart) {
 }
 
 TEST_F(FilesTest, FailsWithPathAndReason) {
-    const auto missing = files.read(u"C:\\no.txt"_s);
+    const auto missing = files.read(u"C:\\no.txt"_path);
     EXPECT_EQ(missing.failure().kind, Failure::Kind::NotFound);
     EXPECT_TRUE(missing.failure().message.contains(u"C:\\no.txt"_s)) << missing.failure().message.toStdString();
     fs::create_directory(data / "folder");
-    EXPECT_FALSE(files.read(u"C:\\folder"_s));
-    EXPECT_FALSE(files.writeWhole(u"C:\\folder"_s, "x"));
-    EXPECT_FALSE(files.removeFile(u"C:\\folder"_s));
-    EXPECT_FALSE(files.copyFile(u"C:\\no.txt"_s, u"C:\\to.txt"_s));
-    EXPECT_FALSE(files.fileExists(u"C:\\to.txt"_s));
+    EXPECT_FALSE(files.read(u"C:\\folder"_path));
+    EXPECT_FALSE(files.writeWhole(u"C:\\folder"_path, "x"));
+    EXPECT_FALSE(files.removeFile(u"C:\\folder"_path));
+    EXPECT_FALSE(files.copyFile(u"C:\\no.txt"_path, u"C:\\to.txt"_path));
+    EXPECT_FALSE(files.fileExists(u"C:\\to.txt"_path));
     ASSERT_EQ(::mkfifo((data / "pipe").c_str(), 0600), 0);
-    EXPECT_FALSE(files.read(u"C:\\pipe"_s)); // and does not wait for a writer
+    EXPECT_FALSE(files.read(u"C:\\pipe"_path)); // and does not wait for a writer
     EXPECT_EQ(countAll(data), 2);
 }
 
@@ -161,7 +164,7 @@ TEST(FilesOnASmallDisk, KeepsTheOldFileWhenTheDiskIsFull) {
         GTEST_SKIP() << "mounting takes root";
     const Drives drives(disk.path(), u'C', {});
     const Files files(drives);
-    const QString path = u"C:\\mispar.txt"_s;
+    const DrivePath path = u"C:\\mispar.txt"_path;
     ASSERT_TRUE(files.writeWhole(path, "101\r\n"));
     const auto full = files.writeWhole(path, QByteArray(200'000, 'x'));
     ASSERT_FALSE(full);
@@ -171,7 +174,7 @@ TEST(FilesOnASmallDisk, KeepsTheOldFileWhenTheDiskIsFull) {
 
     ASSERT_TRUE(disk.makeReadOnly());
     EXPECT_EQ(files.writeWhole(path, "102\r\n").failure().kind, Failure::Kind::AccessDenied);
-    EXPECT_EQ(files.makeFolder(u"C:\\new"_s).failure().kind, Failure::Kind::AccessDenied);
+    EXPECT_EQ(files.makeFolder(u"C:\\new"_path).failure().kind, Failure::Kind::AccessDenied);
     EXPECT_EQ(files.removeFile(path).failure().kind, Failure::Kind::AccessDenied);
     EXPECT_EQ(files.read(path).value(), "101\r\n");
 }
@@ -180,7 +183,7 @@ TEST_F(FilesTest, SnapshotsOfAListStayUntilRefreshed) {
     put("a.jpg");
     FileList list(files, u"*.jpg"_s);
     EXPECT_EQ(list.count(), 0);
-    list.setFolder(u"C:\\"_s);
+    list.setFolder(u"C:\\"_path);
     put("b.jpg");
     EXPECT_EQ(list.count(), 1);
     list.refresh();

@@ -4,6 +4,7 @@
 #include "platform/QtEventPump.h"
 #include "platform/files/MarkedVolume.h"
 #include "platform/files/StatVolume.h"
+#include "support/DrivePathLiteral.h"
 
 #include <QCoreApplication>
 #include <QElapsedTimer>
@@ -38,12 +39,12 @@ TEST(StatVolume, GivesAStableNumberAlsoBeforeTheFolderIsMade) {
     QTemporaryDir folder;
     const Drives drives(toHostPath(folder.path()) / "not" / "yet", u'C', {});
     const StatVolume volume(drives);
-    const auto before = volume.serial(u"C:\\"_s);
+    const auto before = volume.serial(u"C:\\"_path);
     ASSERT_TRUE(before) << before.failure().message.toStdString();
     std::filesystem::create_directories(drives.dataFolder());
-    EXPECT_EQ(*volume.serial(u"C:\\"_s), *before);
+    EXPECT_EQ(*volume.serial(u"C:\\"_path), *before);
     EXPECT_NE(*before, 0);
-    EXPECT_FALSE(volume.serial(u"Q:\\"_s));
+    EXPECT_FALSE(volume.serial(u"Q:\\"_path));
 }
 
 TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
@@ -55,7 +56,7 @@ TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
 
 class PlainVolume : public Volume {
 public:
-    Result<std::int32_t> serial(const QString&) const override { return 12345678; }
+    Result<std::int32_t> serial(const DrivePath&) const override { return 12345678; }
 };
 
 TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
@@ -63,7 +64,9 @@ TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
     const QTemporaryDir folder;
     const HostPath data = toHostPath(folder.path());
     const QStringList here = {u"52:54:00:00:00:01"_s, u"52:54:00:00:00:02"_s};
-    const auto serial = [&](const QStringList& cards) { return *MarkedVolume(plain, data, cards).serial(u"C:\\"_s); };
+    const auto serial = [&](const QStringList& cards) {
+        return *MarkedVolume(plain, data, cards).serial(u"C:\\"_path);
+    };
     const std::int32_t first = serial(here);
     EXPECT_EQ(serial(here), first) << "at the next start";
     EXPECT_EQ(serial({}), first) << "no card can be told";
@@ -76,12 +79,12 @@ TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
     // Another folder on the same volume and machine; a mark that is no mark.
     const QTemporaryDir other;
     const MarkedVolume beside(plain, toHostPath(other.path()), here);
-    const std::int32_t another = *beside.serial(u"C:\\"_s);
+    const std::int32_t another = *beside.serial(u"C:\\"_path);
     EXPECT_NE(another, first);
     ASSERT_TRUE(writeWholeFile(toHostPath(other.path()) / ".lumora-mark", "\"Mark\",\"x\"\r\n"));
-    EXPECT_NE(*beside.serial(u"C:\\"_s), another);
+    EXPECT_NE(*beside.serial(u"C:\\"_path), another);
 
-    EXPECT_EQ(*MarkedVolume(plain, "/proc/none", here).serial(u"C:\\"_s), 12345678) << "a mark that can't be kept";
+    EXPECT_EQ(*MarkedVolume(plain, "/proc/none", here).serial(u"C:\\"_path), 12345678) << "a mark that can't be kept";
 }
 
 TEST(NetworkCards, AreTheBuiltInOnesByTheirAddress) {

@@ -5,6 +5,7 @@
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
 #include "session/SessionState.h"
+#include "support/DrivePathLiteral.h"
 
 #include <gtest/gtest.h>
 
@@ -16,7 +17,8 @@ using namespace Qt::StringLiterals;
 const QString path = u"C:\\pics\\תמונה.jpg"_s;
 
 QString plainLine(int copies, const QString& of) {
-    return BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), {}, of}.compose(LineForm::Short);
+    return BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), {}, DrivePath(of)}.compose(
+        LineForm::Short);
 }
 
 TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
@@ -24,9 +26,9 @@ TEST(ABasket, findsTheFirstLineOfAPathAfterEachKindOfChange) {
         Basket basket;
         basket.setForm(form);
         const auto add = [&](int copies, const QString& of) {
-            basket.append(
-                BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), EditRecord::newPicture(), of}.compose(
-                    form));
+            basket.append(BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), EditRecord::newPicture(),
+                                     DrivePath(of)}
+                              .compose(form));
         };
         const auto find = [&](const char* of) { return basket.FindByPath(QString::fromLatin1(of)); };
         add(1, u"C:\\a.jpg"_s);
@@ -86,9 +88,9 @@ QStringList names(int count) {
 
 TEST(AFolderPager, beginsBehindASecondFolderWithTheLastPictureOfTheFirst) {
     FolderPager pager;
-    pager.addFolder(u"C:\\p"_s, names(3));
+    pager.addFolder(u"C:\\p"_path, names(3));
     pager.FillPageList();
-    pager.addFolder(u"C:\\q"_s, names(5));
+    pager.addFolder(u"C:\\q"_path, names(5));
     const QStringList page = pager.FillPageList();
     EXPECT_EQ(page.first(), u"C:\\p\\03.jpg"_s);
     EXPECT_EQ(page.size(), 6);
@@ -97,26 +99,26 @@ TEST(AFolderPager, beginsBehindASecondFolderWithTheLastPictureOfTheFirst) {
 TEST(AFolderPager, doublesAnOrdinaryFolderButNoDriveRoot) {
     FolderPager pager;
     for (int i = 0; i < 2; ++i)
-        pager.addFolder(u"C:\\p"_s, names(4));
+        pager.addFolder(u"C:\\p"_path, names(4));
     EXPECT_EQ(pager.count(), 8);
-    EXPECT_EQ(pager.addFolder(u"E:\\"_s, names(4)), 4);
+    EXPECT_EQ(pager.addFolder(u"E:\\"_path, names(4)), 4);
     EXPECT_EQ(pager.item(8), u"E:\\01.jpg"_s);
     pager.FillPageList();
     const int position = pager.currentIndex();
-    EXPECT_EQ(pager.addFolder(u"E:\\"_s, names(4)), 0);
+    EXPECT_EQ(pager.addFolder(u"E:\\"_path, names(4)), 0);
     EXPECT_EQ(pager.currentIndex(), position);
 }
 
 TEST(AFolderPager, takesNoPictureOfAFolderForOneBesideIt) {
     FolderPager pager;
-    pager.addFolder(u"C:\\p"_s, {u"a01.jpg"_s});
-    EXPECT_EQ(pager.addFolder(u"C:\\p\\a"_s, names(2)), 2);
+    pager.addFolder(u"C:\\p"_path, {u"a01.jpg"_s});
+    EXPECT_EQ(pager.addFolder(u"C:\\p\\a"_path, names(2)), 2);
 }
 
 TEST(AFolderPager, goesBackByThePageInViewAndTheOneBefore) {
     for (const auto& [pages, firstAfterBack] : {std::pair{1, 1}, {2, 1}, {3, 13}, {4, 25}}) {
         FolderPager pager;
-        pager.addFolder(u"C:\\p"_s, names(60));
+        pager.addFolder(u"C:\\p"_path, names(60));
         for (int i = 0; i < pages; ++i)
             pager.FillPageList();
         pager.PageBack();
@@ -131,7 +133,7 @@ struct Choosing {
         order.maat = u"מבריק"_s;
         order.Bord = u"NB"_s;
         choice.setForm(form);
-        choice.addFolder(u"C:\\p"_s, names(14));
+        choice.addFolder(u"C:\\p"_path, names(14));
         choice.nextPage();
     }
     QStringList lines() const { return choice.basket().lines().items(); }
@@ -176,7 +178,7 @@ TEST(AChoice, countsEachOfTwoCellsWithTheSamePictureByItself) {
     Choosing at;
     at.choice.clear();
     for (int i = 0; i < 2; ++i)
-        at.choice.addFolder(u"C:\\q"_s, names(1));
+        at.choice.addFolder(u"C:\\q"_path, names(1));
     at.choice.nextPage();
     at.choice.choose(0, {});
     at.choice.setCopies(0, 5, {});

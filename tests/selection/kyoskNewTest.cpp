@@ -1,6 +1,5 @@
 #include "selection/pictures/kyoskNew.h"
 
-#include "common/DrivePathText.h"
 #include "editing/editor/BigPics.h"
 #include "editing/editor/tFrmNew.h"
 #include "editing/render/StoredSmallView.h"
@@ -31,11 +30,11 @@ protected:
     tFrmNew& editor() { return chain.load<tFrmNew>(); }
 
     // count small pictures "01.jpg", ... in a folder; the folder is made.
-    void makePictures(const QString& folder, int count, PictureSize size = {40, 30}) {
+    void makePictures(const DrivePath& folder, int count, PictureSize size = {40, 30}) {
         makeFolder(folder);
         for (int i = 1; i <= count; ++i) {
             const QString name = u"%1.jpg"_s.arg(i, 2, 10, QLatin1Char('0'));
-            ASSERT_TRUE(saveJpeg(Bitmap(size.width, size.height, Qt::red), host(JoinDrivePath(folder, name)), 80));
+            ASSERT_TRUE(saveJpeg(Bitmap(size.width, size.height, Qt::red), host(folder / name), 80));
         }
     }
 
@@ -45,13 +44,13 @@ protected:
     }
 
     void pick(kyoskNew& page, const QString& picture) {
-        machine.dialogs.picks += picture;
+        machine.dialogs.picks += DrivePath(picture);
         page.Image5_Click();
     }
 
     // The page with a folder of so many pictures.
     kyoskNew& openWith(int count) {
-        makePictures(u"C:\\p"_s, count);
+        makePictures(u"C:\\p"_path, count);
         kyoskNew& page = open();
         pick(page, u"C:\\p\\01.jpg"_s);
         return page;
@@ -103,8 +102,8 @@ TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesO
 }
 
 TEST_F(ThePictures, leaveACellEmptyForAFileThatCannotBeRead) {
-    makePictures(u"C:\\p"_s, 3);
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\02.jpg"_s, "no picture"));
+    makePictures(u"C:\\p"_path, 3);
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\02.jpg"_path, "no picture"));
     kyoskNew& page = open();
     pick(page, first);
     EXPECT_EQ(shownCells(page), 2);
@@ -167,16 +166,16 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhenTheyAreChosenAnew) {
     QString record = EditRecord::newPicture();
     record.replace(15, 3, u"130"_s).replace(38, 3, u"RED"_s);
     state.edit.EditState = record;
-    state.edit.PicturePath = first;
+    state.edit.PicturePath = DrivePath(first);
     page.ZZvvA_Click();
     const QStringList lines = page.controls().List1.items();
     EXPECT_EQ(lines.first(), u"2 1015GNB"_s + record + first);
-    const Result<QByteArray> all = machine.files.read(u"C:\\2000lumora\\Tik4txt\\all_list.txt"_s);
-    const Result<QByteArray> one = machine.files.read(u"C:\\2000lumora\\Tik4txt\\00onepic.txt"_s);
+    const Result<QByteArray> all = machine.files.read(u"C:\\2000lumora\\Tik4txt\\all_list.txt"_path);
+    const Result<QByteArray> one = machine.files.read(u"C:\\2000lumora\\Tik4txt\\00onepic.txt"_path);
     ASSERT_TRUE(all && one);
     EXPECT_EQ(*all, (lines.join(u"\r\n"_s) + u"\r\n"_s).toLatin1());
     EXPECT_EQ(*one, (lines.first() + u"\r\n"_s).toLatin1());
-    state.edit.PicturePath = u"C:\\p\\02.jpg"_s;
+    state.edit.PicturePath = u"C:\\p\\02.jpg"_path;
     page.Picture1_Click(0);
     EXPECT_EQ(state.edit.ZoomPercent, 130);
     EXPECT_EQ(state.edit.TempRedName, u"C;]p]01.jpg"_s);
@@ -184,7 +183,7 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhenTheyAreChosenAnew) {
 }
 
 TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
-    makePictures(u"C:\\q"_s, 1, {1000, 800});
+    makePictures(u"C:\\q"_path, 1, {1000, 800});
     kyoskNew& page = openWith(1);
     page.Picture1_Click(0);
     EXPECT_EQ(page.controls().Label6.text, u"  איכות נמוכה מאוד  30 / 40"_s);
@@ -258,7 +257,7 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
     editor().Image4_Click(); // grey
     editor().CommandDone_Click();
     EXPECT_EQ(chain.front(), &page);
-    ASSERT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    ASSERT_TRUE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))));
     const auto redAt = [&](std::size_t cell) {
         return page.controls().Picture1[cell].bitmap.image().pixelColor(50, 30).red();
     };
@@ -274,7 +273,7 @@ TEST_F(ThePictures, thatTheEditorChangedShowTheirStoredViewUntilTheyAreChosenAne
     page.Command13_Click(0);
     EXPECT_GT(redAt(0), 200);
     page.Picture1_Click(0);
-    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))));
     EXPECT_GT(redAt(0), 200);
     page.Command13_Click(0);
     EXPECT_EQ(page.openCell(), -1);
@@ -323,14 +322,14 @@ TEST_F(ThePictures, areLeftWithAllThatWasSeenInTheirRecord) {
 TEST_F(ThePictures, thatCannotBeOpenedForEditingStayInTheBasketAsTheyAre) {
     state.Optint = OrderKind::EditedPrint;
     kyoskNew& page = openWith(2);
-    ASSERT_TRUE(machine.files.writeWhole(first, "no picture"));
+    ASSERT_TRUE(machine.files.writeWhole(DrivePath(first), "no picture"));
     page.Picture1_Click(0);
     EXPECT_EQ(chain.front(), &page);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     EXPECT_EQ(page.controls().List1.item(0), u"1 1015GNB"_s + EditRecord::newPicture() + first);
     page.Picture1_Click(1);
     EXPECT_EQ(chain.front(), &editor());
-    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))));
 }
 
 TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
@@ -347,7 +346,7 @@ TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     page.Command7_Click();
     ASSERT_EQ(chain.front()->id(), PageId::B3);
     EXPECT_EQ(state.handOver.lines.value(0).mid(9 + 12, 6), u"270102"_s);
-    EXPECT_TRUE(machine.files.fileExists(StoredSmallView::path(state, first)));
+    EXPECT_TRUE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))));
     EXPECT_EQ(chain.find(PageId::tFrmNew), nullptr);
     EXPECT_EQ(chain.find(PageId::BigPics), nullptr);
     // A further order begins without the record of this one.

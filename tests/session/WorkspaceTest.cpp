@@ -19,8 +19,8 @@ protected:
         ASSERT_TRUE(workspace.MakeCounterFolder().ok());
         ASSERT_TRUE(workspace.MakeOrderFolder().ok());
     }
-    void put(const QString& path, const QByteArray& bytes = "x") {
-        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.toStdString();
+    void put(const DrivePath& path, const QByteArray& bytes = "x") {
+        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
     }
 
     TestPlatform machine;
@@ -31,16 +31,16 @@ protected:
 TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
     state.MisparHazmana = u"77"_s;
     make();
-    EXPECT_EQ(machine.files.folders(u"C:\\"_s), QStringList({"2000lumora", "vedron"}));
+    EXPECT_EQ(machine.files.folders(u"C:\\"_path), QStringList({"2000lumora", "vedron"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::root(state)), QStringList({"!!000", "misgarot", "zmany"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::zmany(state)), QStringList({"job_folder", "ktanim", "tempred"}));
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\!!000\\mana.txt"_s), "1\r\n");
+    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\!!000\\mana.txt"_path), "1\r\n");
 }
 
 TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
-    put(u"C:\\2000lumora"_s);
+    put(u"C:\\2000lumora"_path);
     const Result<void> made = workspace.MakeWorkspace();
     ASSERT_FALSE(made.ok());
     EXPECT_TRUE(made.failure().message.contains(u"2000lumora")) << made.failure().message.toStdString();
@@ -90,12 +90,12 @@ TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
                               "C:\\2000lumora\\zmany\\tempred\\000.bmp", "C:\\2000lumora\\pratim.txt",
                               "C:\\2000lumora\\!!000\\kept.jpp",         "C:\\2000lumora\\000.jpg"};
     for (const QString& path : gone + kept)
-        put(path);
+        put(DrivePath(path));
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     for (const QString& path : gone)
-        EXPECT_FALSE(machine.files.fileExists(path)) << path.toStdString();
+        EXPECT_FALSE(machine.files.fileExists(DrivePath(path))) << path.toStdString();
     for (const QString& path : kept)
-        EXPECT_TRUE(machine.files.fileExists(path)) << path.toStdString();
+        EXPECT_TRUE(machine.files.fileExists(DrivePath(path))) << path.toStdString();
 }
 
 TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
@@ -105,21 +105,21 @@ TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
     ASSERT_TRUE(folder);
     const HostPath odd = *folder / "\xE6\xBC\xA2.jpg";
     std::ofstream(odd) << "x";
-    put(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_s);
+    put(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_path);
     ASSERT_TRUE(workspace.CleanWorkspace().ok());
     EXPECT_TRUE(std::filesystem::exists(odd));
-    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_s));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_path));
 }
 
 TEST_F(WorkspaceTest, CleansTheHistoryButForTheFirstFileOfEachOrder) {
     make();
-    const QString order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_s;
-    const QString other = u"C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106"_s;
+    const DrivePath order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_path;
+    const DrivePath other = u"C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106"_path;
     ASSERT_TRUE(machine.files.makeFolder(order).ok());
     ASSERT_TRUE(machine.files.makeFolder(other).ok());
     for (const char* name : {"!105_1234.jpp", "1 1015.jpp", "1 1318.JPP", "order.txt", "part.prk"})
-        put(order + u'\\' + QString::fromLatin1(name));
-    put(other + u"\\only.jpp"_s);
+        put(order / QString::fromLatin1(name));
+    put(other / u"only.jpp");
     workspace.CleanHistory();
     EXPECT_EQ(machine.files.names(order, u"*"_s),
               QStringList({"!105_1234.jpp", "1 1318.JPP", "order.txt", "part.prk"}));

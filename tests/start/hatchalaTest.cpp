@@ -53,9 +53,9 @@ TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     hatchala& page = start();
     EXPECT_EQ(state.EnglishTips, 0);
     EXPECT_EQ(state.SugTzad, 60);
-    EXPECT_EQ(state.DiskRoot, u"C:\\");
+    EXPECT_EQ(state.DiskRoot, u"C:\\"_path);
     EXPECT_EQ(state.profile.AdUrl1, u"http://www.lumora.example//ad01.jpg");
-    EXPECT_EQ(state.profile.AdFile2, u"C:\\lumora\\zmany\\ad02.jpg");
+    EXPECT_EQ(state.profile.AdFile2, u"C:\\lumora\\zmany\\ad02.jpg"_path);
     EXPECT_EQ(page.controls().List1.items(), QStringList({"* Haifa", "* Yaffo"}));
     for (const Caption* label : {&page.controls().Label4Tel, &page.controls().Label4Tel2, &page.controls().Label4Zel})
         EXPECT_EQ(label->text, u"09-9");
@@ -185,9 +185,9 @@ TEST_F(hatchalaTest, TheAdvertisingPictureMovesBetweenItsLimits) {
 TEST_F(hatchalaTest, APictureThatAnInstallationPlacedShowsWhereNoFolderCanBeMade) {
     hatchala& page = start();
     site.answer = "picture";
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_s, "a file in the way").ok());
+    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_path, "a file in the way").ok());
     page.Timer1_Tick();
-    EXPECT_EQ(page.controls().Picture4, QString());
+    EXPECT_EQ(page.controls().Picture4, DrivePath());
     std::filesystem::create_directories(machine.drives.dataFolder() / "lumora" / "zmany");
     ASSERT_TRUE(machine.files.writeWhole(state.profile.AdFile1, "picture").ok());
     page.Timer1_Tick();
@@ -211,7 +211,7 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     page.DownloadSettings();
     page.Command5_Click();
     EXPECT_EQ(page.controls().List4pices.count(), 21);
-    const QString path = u"C:\\2000lumora\\tarvelmond.txt"_s;
+    const DrivePath path = u"C:\\2000lumora\\tarvelmond.txt"_path;
     EXPECT_EQ(machine.files.read(path)->size(), 203);
     const QString text = page.controls().Label5.text;
     page.Command4_Click();
@@ -229,7 +229,7 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     EXPECT_EQ(site.urls.last(), u"http://settings.lumora.example/00natoonim/tarvelmond.txt");
     EXPECT_EQ(page.controls().List2.items(), QStringList({"TK1=0^TK1=5^X=1^", "second"}));
     EXPECT_EQ(page.controls().List4pices.items(), QStringList({"TK1=5", "X=1"}));
-    page.ReadSettingsFile(u"C:\\2000lumora\\other.txt"_s);
+    page.ReadSettingsFile(u"C:\\2000lumora\\other.txt"_path);
     EXPECT_EQ(machine.dialogs.messages.last(), u"No Server");
     EXPECT_TRUE(page.controls().List2.isEmpty());
 }

@@ -55,7 +55,7 @@ struct FtpFrmRig : SendingRig {
     // The local folder and the small picture of the summary, by leaf name.
     std::map<QString, QByteArray> localFiles() const {
         auto bytes = SendingRig::localFiles();
-        if (const auto picture = test.files.read(u"C:\\2000lumora\\000.jpg"_s))
+        if (const auto picture = test.files.read(u"C:\\2000lumora\\000.jpg"_path))
             bytes[proof()] = *picture;
         return bytes;
     }
@@ -64,7 +64,7 @@ struct FtpFrmRig : SendingRig {
     void takeUpAgain(const QStringList& leaves) {
         state.transfer.SugMishloah = Sending::Resend;
         for (const QString& leaf : leaves)
-            state.handOver.lines += local(leaf);
+            state.handOver.lines += local(leaf).text();
     }
     // The page comes to the front and acts.
     FtpFrm& start() {

@@ -22,8 +22,9 @@ struct PageRig {
         for (const PageId id : ids)
             chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
     }
-    void makeFolder(const QString& path) { std::filesystem::create_directories(host(path)); }
-    HostPath host(const QString& path) const { return *machine.drives.toHost(path); }
+    void makeFolder(const auto& path) { std::filesystem::create_directories(host(path)); }
+    HostPath host(const DrivePath& path) const { return *machine.drives.toHost(path); }
+    HostPath host(const QString& path) const { return host(DrivePath(path)); }
 
     TestPlatform machine;
     SessionState state;

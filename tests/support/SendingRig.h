@@ -12,24 +12,24 @@ namespace lumora {
 struct SendingRig {
     explicit SendingRig(Internet& line)
         : test(line) {
-        state.DiskRoot = u"C:\\"_s;
+        state.DiskRoot = u"C:\\"_path;
         state.transfer.OrderFolder = folder();
         ClientProfile& profile = state.profile;
         profile.ClientCode = u"tarvelmond"_s;
         profile.ReportUrl = u"http://192.0.2.10/aaaqamootreport/padd.asp"_s;
-        for (const QString& path : {u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s, folder()})
+        for (const DrivePath& path : {u"C:\\2000lumora"_path, u"C:\\2000lumora\\!!000"_path, folder()})
             (void)test.files.makeFolder(path);
         write(first(), QByteArray("\xFF\xD8\r\n\n\r\0--OLA_GRAIN--\r\n", 23).repeated(300));
         write(second(), QByteArray("\xFF\xD8\n\n second").repeated(500));
     }
 
     static QString name() { return u"2026_11_21_KUP_1234^105"_s; }
-    static QString folder() { return u"C:\\2000lumora\\!!000\\"_s + name(); }
+    static DrivePath folder() { return u"C:\\2000lumora\\!!000"_path / name(); }
     static QString log() { return name() + u".txt"_s; }
     static QString first() { return u"021015GNB0000_03AABB.jpp"_s; }
     static QString second() { return u"111015GNB0001_03AACC.jpp"_s; }
     static QString list() { return u"filelisthom.txt"_s; }
-    static QString local(const QString& leaf) { return folder() + u'\\' + leaf; }
+    static DrivePath local(const QString& leaf) { return folder() / leaf; }
 
     void write(const QString& leaf, const QByteArray& bytes) { (void)test.files.writeWhole(local(leaf), bytes); }
     // What the local folder holds by leaf name, without the server's list.

@@ -8,6 +8,7 @@
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
 #include "platform/line/Mail.h"
+#include "support/DrivePathLiteral.h"
 
 #include <QStringList>
 #include <QTemporaryDir>
@@ -31,9 +32,9 @@ public:
         questionTitles += title;
         return !answers.isEmpty() && answers.takeFirst();
     }
-    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title, Offer) override {
-        pickRequests += prompt + u'|' + initialFolder + u'|' + title;
-        return picks.isEmpty() ? QString() : picks.takeFirst();
+    DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title, Offer) override {
+        pickRequests += prompt + u'|' + initialFolder.text() + u'|' + title;
+        return picks.isEmpty() ? DrivePath() : picks.takeFirst();
     }
 
     QStringList messages;
@@ -41,8 +42,8 @@ public:
     QStringList questions;
     QStringList questionTitles;
     QStringList pickRequests;
-    QStringList picks;   // answers of the next file dialogs, in order
-    QList<bool> answers; // answers of the next questions, in order
+    QList<DrivePath> picks; // answers of the next file dialogs, in order
+    QList<bool> answers;    // answers of the next questions, in order
 };
 
 class FixedClock : public Clock {
@@ -74,7 +75,7 @@ private:
 class RecordedShell : public Shell {
 public:
     void openWebPage(const QString& url) override { webPages += url; }
-    void openFolder(const QString& drivePath) override { folders += drivePath; }
+    void openFolder(const DrivePath& folder) override { folders += folder.text(); }
     void copyToClipboard(const QString& text) override { clipboard = text; }
 
     QStringList webPages;
@@ -84,7 +85,7 @@ public:
 
 class FixedVolume : public Volume {
 public:
-    Result<std::int32_t> serial(const QString&) const override {
+    Result<std::int32_t> serial(const DrivePath&) const override {
         if (fails)
             return Failure{Failure::Kind::Other, u"no serial"_s};
         return number;

@@ -228,7 +228,7 @@ TEST_F(FtpFrmTest, WithoutItsTextTheOrderSendsThePicturesAndSaysSo) {
 }
 
 TEST_F(FtpFrmTest, ListsNothingWithoutAnOrder) {
-    for (const QString& folder : {QString(), u"***"_s}) {
+    for (const DrivePath& folder : {DrivePath(), u"***"_path}) {
         FtpFrmRig order(lab);
         order.state.transfer.OrderFolder = folder;
         FtpFrm& page = order.start();
@@ -252,7 +252,7 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
     rig.write(u"a_001_002.prk"_s, "1");
     rig.write(u"a_002_002.prk"_s, "2");
     EXPECT_EQ(FtpOrderFiles(rig.test.files, OrderFolder(FtpFrmRig::folder()), {}, true).last(),
-              FtpFrmRig::folder() + u'\\')
+              FtpFrmRig::local({}).text())
         << "without a sheet the folder itself, whose put fails";
     rig.send();
     EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::sheet(), u"a_001_002.prk"_s, u"a_002_002.prk"_s,

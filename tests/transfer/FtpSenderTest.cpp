@@ -12,7 +12,7 @@ namespace {
 using enum SendingMoment;
 
 const QString base = u"zalamim234"_s;
-const QString folder = u"C:\\order^1"_s;
+const DrivePath folder = u"C:\\order^1"_path;
 
 // The FTP sender over a lab that has the folder of the orders, with an order of three files.
 struct Line {
@@ -30,11 +30,11 @@ struct Line {
     }
 
     static QStringList names() { return {u"log.txt"_s, u"01a.jpp"_s, u"02b.jpp"_s}; }
-    static QString path(const QString& name) { return folder + u'\\' + name; }
+    static DrivePath path(const QString& name) { return folder / name; }
     void order(const QStringList& leaves) {
         sender.clearLists();
         for (const QString& leaf : leaves)
-            sender.lists.List3.append(path(leaf));
+            sender.lists.List3.append(path(leaf).text());
         sender.beginOrder();
     }
     FakeLab::Folder& remote() { return lab.folders[base + u"/order^1"_s]; }
@@ -261,7 +261,7 @@ TEST_F(FtpSenderTest, AStopCutsTheFileInHandWhichCountsAsBrokenAndIsSentAgain) {
         EXPECT_EQ(line.told.count(Stopped), 1);
         EXPECT_EQ(line.told.troubles.size(), 0u) << "what a stop has cut is no trouble";
         EXPECT_EQ(line.lab.puts.size(), names().indexOf(stopAt) + 1);
-        EXPECT_EQ(line.sender.lists.List4Broken.items(), QStringList(path(stopAt)));
+        EXPECT_EQ(line.sender.lists.List4Broken.items(), QStringList(path(stopAt).text()));
         EXPECT_LT(line.remote()[stopAt].size(), stopAt.size() * 50);
         line.lab.onPut = {};
         line.sender.refill();

@@ -111,7 +111,7 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
 
 TEST_F(UploadFormTest, AServerThatIsBackAtTheThirdAttemptTakesAnOrderOfThreeFiles) {
     for (const QString& name : {UploadFormRig::sheet(), UploadFormRig::third()})
-        ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() + u'\\' + name));
+        ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() / name));
     // Three calls of the check at load and of each attempt.
     lab.deadCalls = 9;
     lab.deadPosts = 6;
@@ -141,7 +141,7 @@ TEST_F(UploadFormTest, NothingIsWrittenOutsideTheOrderAndTheKeptList) {
     const auto everything = [&] {
         QStringList all;
         for (const char* folder : {"C:\\", "C:\\2000lumora", "C:\\2000lumora\\!!000"})
-            all += rig.test.files.names(QString::fromLatin1(folder), u"*.*"_s);
+            all += rig.test.files.names(DrivePath(QString::fromLatin1(folder)), u"*.*"_s);
         return all;
     };
     const QStringList before = everything();
@@ -184,7 +184,7 @@ TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
     EXPECT_EQ(page.look().sign, SendingSign::Bad);
     EXPECT_EQ(page.lists().List4Kvazim.count(), 5);
     EXPECT_FALSE(lab.posted.contains(UploadFormRig::list()));
-    EXPECT_FALSE(rig.test.files.fileExists(UploadFormRig::folder() + u'\\' + UploadFormRig::list()));
+    EXPECT_FALSE(rig.test.files.fileExists(UploadFormRig::folder() / UploadFormRig::list()));
 }
 
 TEST_F(UploadFormTest, NothingMoreIsSentOnceThePageIsLeft) {

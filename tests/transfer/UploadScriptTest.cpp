@@ -29,13 +29,13 @@ struct UploadScriptTest : ::testing::Test {
     const QString extra = u"value1=Hello&value2=World!"_s;
     const QString path = u"C:\\a.jpg"_s;
 
-    void SetUp() override { ASSERT_TRUE(test.files.writeWhole(path, "xyz")); }
+    void SetUp() override { ASSERT_TRUE(test.files.writeWhole(DrivePath(path), "xyz")); }
 };
 
 TEST_F(UploadScriptTest, TheTwoFormsDifferInTypeVersionAndAnnouncedLength) {
-    EXPECT_EQ(script.MultipartPost(order, {path}, u"http://192.0.2.10/p/getfile2.php"_s, u"C:\\"_s, extra, {}, {}),
+    EXPECT_EQ(script.MultipartPost(order, {path}, u"http://192.0.2.10/p/getfile2.php"_s, u"C:\\"_path, extra, {}, {}),
               u"stored"_s);
-    EXPECT_EQ(script.MultipartPostInet(order, {path}, u"192.0.2.10"_s, u"/p/getfile2.php"_s, u"C:\\"_s, extra),
+    EXPECT_EQ(script.MultipartPostInet(order, {path}, u"192.0.2.10"_s, u"/p/getfile2.php"_s, u"C:\\"_path, extra),
               u"stored"_s);
     ASSERT_EQ(lab.posts.size(), 2u);
     const QString address =
@@ -46,15 +46,15 @@ TEST_F(UploadScriptTest, TheTwoFormsDifferInTypeVersionAndAnnouncedLength) {
     EXPECT_EQ(lab.posts[1].contentType, "multipart/form-data, boundary=OLA_GRAIN");
     EXPECT_EQ(lab.posts[0].announcedLength, 0);
     EXPECT_EQ(lab.posts[1].announcedLength, 249);
-    ASSERT_TRUE(test.files.writeWhole(u"C:\\b.jpg"_s, "12"));
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\b.jpg"_path, "12"));
     const auto announced = [&](const QStringList& files) {
-        (void)script.MultipartPostInet(order, files, u"192.0.2.10"_s, u"/p/getfile2.php"_s, u"C:\\"_s, {});
+        (void)script.MultipartPostInet(order, files, u"192.0.2.10"_s, u"/p/getfile2.php"_s, u"C:\\"_path, {});
         return lab.posts.back().announcedLength;
     };
     EXPECT_EQ(announced({path, u"C:\\b.jpg"_s}), 467);
     EXPECT_EQ(lab.urls.last(), u"http://192.0.2.10/p/getfile2.php?folder=2026_11_21_KUP_1234^105&"_s)
         << "an empty rest leaves its mark";
-    ASSERT_TRUE(test.files.writeWhole(path, {}));
+    ASSERT_TRUE(test.files.writeWhole(DrivePath(path), {}));
     EXPECT_EQ(announced({path}), 243);
     EXPECT_EQ(lab.posts[0].version, PostRequest::Version::Http11);
     EXPECT_EQ(lab.posts[1].version, PostRequest::Version::Http10);
@@ -63,14 +63,14 @@ TEST_F(UploadScriptTest, TheTwoFormsDifferInTypeVersionAndAnnouncedLength) {
 TEST_F(UploadScriptTest, AFileThatIsMissingOrWouldBreakItsHeaderIsNeverSent) {
     for (const char* name : {"C:\\missing.jpg", "C:\\a\"b.jpg", "C:\\a\r\nX: y.jpg"}) {
         const QString file = QString::fromLatin1(name);
-        EXPECT_EQ(script.MultipartPost(order, {path, file}, u"http://h/"_s, u"C:\\"_s, {}, {}, {}), QString());
+        EXPECT_EQ(script.MultipartPost(order, {path, file}, u"http://h/"_s, u"C:\\"_path, {}, {}, {}), QString());
         EXPECT_TRUE(script.failed()) << name;
-        EXPECT_TRUE(script.MultipartPostInet(order, {file}, u"h"_s, u"/"_s, u"C:\\"_s, {}).startsWith(u"Error: "_s));
+        EXPECT_TRUE(script.MultipartPostInet(order, {file}, u"h"_s, u"/"_s, u"C:\\"_path, {}).startsWith(u"Error: "_s));
     }
     EXPECT_TRUE(lab.posts.empty());
     lab.deadPosts = 2;
-    EXPECT_EQ(script.MultipartPost(order, {path}, u"http://h/"_s, u"C:\\"_s, {}, {}, {}), QString());
-    EXPECT_EQ(script.MultipartPostInet(order, {path}, u"h"_s, u"/"_s, u"C:\\"_s, {}), u"Error: nobody answers"_s);
+    EXPECT_EQ(script.MultipartPost(order, {path}, u"http://h/"_s, u"C:\\"_path, {}, {}, {}), QString());
+    EXPECT_EQ(script.MultipartPostInet(order, {path}, u"h"_s, u"/"_s, u"C:\\"_path, {}), u"Error: nobody answers"_s);
 }
 
 TEST(ServerListTest, ATextOf35CharactersIsNoListing) {

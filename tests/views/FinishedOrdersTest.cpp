@@ -20,16 +20,16 @@ namespace {
 // Finished orders of a busy week, the last two of one day and the very last in pieces.
 QString makeOrders(Walk& walk) {
     const Files& files = walk.program().platform().files;
-    const QString orders = WorkspacePaths::orders(walk.program().state());
+    const DrivePath orders = WorkspacePaths::orders(walk.program().state());
     EXPECT_TRUE(files.makeFolder(WorkspacePaths::root(walk.program().state())).ok());
     EXPECT_TRUE(files.makeFolder(orders).ok());
     QString last;
     for (int number = 98; number <= 106; ++number) {
         last = u"2026_11_%1_KUP_1234^%2"_s.arg(number - 80).arg(number) + (number == 106 ? u"P"_s : QString());
-        const QString folder = orders + u'\\' + last;
+        const DrivePath folder = orders / last;
         EXPECT_TRUE(files.makeFolder(folder).ok());
         const auto write = [&](const QString& name, const QByteArray& bytes) {
-            EXPECT_TRUE(files.writeWhole(folder + u'\\' + name, bytes).ok());
+            EXPECT_TRUE(files.writeWhole(folder / name, bytes).ok());
         };
         write(last + u".txt"_s, "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n");
         Bitmap sheet(640, 480, Qt::white);
@@ -37,7 +37,7 @@ QString makeOrders(Walk& walk) {
         for (int i = 0; i < 12; ++i)
             painter.fillRect(30 + i % 4 * 150, 120 + i / 4 * 110, 120, 80, QColor::fromHsv(i * 30, 120, 200));
         painter.end();
-        EXPECT_TRUE(saveJpeg(sheet, *files.drives().toHost(folder + u"\\!106_1234.jpp"_s), 90).ok());
+        EXPECT_TRUE(saveJpeg(sheet, *files.drives().toHost(folder / u"!106_1234.jpp"), 90).ok());
         for (int i = 0; i < 9; ++i)
             write(u"0%1 1015GNB000%2_0%3AABB.jpp"_s.arg(i % 3 + 1).arg(i).arg(i), "print");
         for (int i = 1; i <= 3 && number == 106; ++i)

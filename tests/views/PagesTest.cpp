@@ -104,7 +104,7 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     look(walk, u"23-fit"_s);
     walk.press(u"nnn"_s, u"Option5"_s);
     walk.toPictures();
-    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() / u"IMG_0001.jpg"; };
     walk.press(u"kyoskNew"_s, u"Image5"_s);
     walk.settle(300);
     look(walk, u"23-whole-folder"_s);
@@ -125,7 +125,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     state.Optint = OrderKind::EditedPrint;
     state.shemot.ppr = u"10/15"_s;
     state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
-    const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder();
+    const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder().text();
     state.handOver.lines = {code + u"\\missing picture.jpg"_s};
     for (int i = 1; i <= 12; ++i)
         state.handOver.lines += code + u"\\IMG_00%1.jpg"_s.arg(i, 2, 10, QChar(u'0'));
@@ -190,7 +190,7 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     lookAtRest(u"47-album-bill"_s);
     walk.press(u"nnn"_s, u"Command22"_s);
     walk.waitFor(u"kyoskNew"_s);
-    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() / u"IMG_0001.jpg"; };
     walk.press(u"kyoskNew"_s, u"Image5"_s);
     walk.settle(300);
     EXPECT_TRUE(walk.pressable(u"kyoskNew"_s, u"Image13"_s));

@@ -54,7 +54,7 @@ class RedEyeView : public PageLook {
 protected:
     RedEyeView()
         : walk(GetParam()) {
-        const QString path = walk.pictureFolder() + u"\\IMG_0001.jpg"_s;
+        const DrivePath path = walk.pictureFolder() / u"IMG_0001.jpg";
         EXPECT_TRUE(saveJpeg(flashPhotograph(), *walk.program().platform().files.drives().toHost(path), 95).ok());
         walk.program().state().edit.PicturePath = path;
         walk.program().chain().load<RedI>().open(path);

@@ -4,6 +4,7 @@
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/Workspace.h"
 #include "support/FakeWebLab.h"
 #include "transfer/ftp/FtpFrm.h"
 #include "transfer/http/UploadForm.h"
@@ -34,21 +35,19 @@ protected:
         SessionState& state = walk.program().state();
         lab.folders[state.profile.FtpFolder2];
         state.MisparHazmana = u"105"_s;
-        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000\\"_s + orderName;
-        QString folder = u"C:"_s;
-        for (const QString& part : {u"\\2000lumora"_s, u"\\!!000"_s, u'\\' + orderName}) {
-            folder += part;
+        state.transfer.OrderFolder = u"C:\\2000lumora\\!!000"_path / orderName;
+        for (const DrivePath& folder :
+             {WorkspacePaths::root(state), WorkspacePaths::orders(state), state.transfer.OrderFolder})
             EXPECT_TRUE(files().folderExists(folder) || files().makeFolder(folder).ok());
-        }
         for (const QString& name : {u"!105_1234.jpp"_s, first, u"111015GNB0001_03AACC.jpp"_s})
             write(name);
-        EXPECT_TRUE(files().writeWhole(state.transfer.OrderFolder + u'\\' + orderName + u".txt"_s,
+        EXPECT_TRUE(files().writeWhole(state.transfer.OrderFolder / (orderName + u".txt"_s),
                                        "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n"));
     }
 
     const Files& files() { return walk.program().platform().files; }
     void write(const QString& name) {
-        EXPECT_TRUE(files().writeWhole(walk.program().state().transfer.OrderFolder + u'\\' + name, "bytes"));
+        EXPECT_TRUE(files().writeWhole(walk.program().state().transfer.OrderFolder / name, "bytes"));
     }
     FakeLab::Folder& remote() { return lab.folders[walk.program().state().profile.FtpFolder2 + u'/' + orderName]; }
     template <class P>
@@ -138,7 +137,7 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
 
     SessionState& state = walk.program().state();
     state.transfer.SugMishloah = Sending::Resend;
-    const QString path = state.transfer.OrderFolder + u'\\' + first;
+    const QString path = (state.transfer.OrderFolder / first).text();
     remote().clear();
     state.handOver.lines = {path, path};
     auto& twice = open<FtpFrm>();
@@ -180,7 +179,7 @@ TEST_P(SendingLook, WithoutAnOrderAndWithoutAServer) {
     walk.program().dialogs().closeMessages();
     look(walk, u"23-no-server"_s);
     state.profile.FtpServer = u"192.0.2.10"_s;
-    state.transfer.OrderFolder.clear();
+    state.transfer.OrderFolder = {};
     until(open<FtpFrm>(), SendingPhase::NoOrder);
     look(walk, u"23-no-order"_s);
     until(open<UploadForm>(), SendingPhase::NoOrder);

@@ -24,13 +24,13 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     Walk walk(GetParam(), u"[Switches]\nSplitPage = yes\n"_s);
     EXPECT_TRUE(walk.program().state().SplitPage);
     const Files& files = walk.program().platform().files;
-    const QString order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_s;
-    for (const QString& folder : {u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s, order})
+    const DrivePath order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_path;
+    for (const DrivePath& folder : {order.parent().parent(), order.parent(), order})
         ASSERT_TRUE(files.makeFolder(folder).ok());
     for (int i = 1; i <= 6; ++i)
         ASSERT_TRUE(
-            files.writeWhole(order + u"\\0%1 1015GNB000%1_03AABB.jpp"_s.arg(i), QByteArray(i * 270000, 'x')).ok());
-    ASSERT_TRUE(files.writeWhole(order + u"\\2026_11_21_KUP_1234^105.txt"_s, "the order").ok());
+            files.writeWhole(order / u"0%1 1015GNB000%1_03AABB.jpp"_s.arg(i), QByteArray(i * 270000, 'x')).ok());
+    ASSERT_TRUE(files.writeWhole(order / u"2026_11_21_KUP_1234^105.txt", "the order").ok());
 
     walk.program().chain().show(PageId::MoogMeret);
     walk.waitFor(u"MoogMeret"_s);
@@ -44,11 +44,11 @@ TEST_P(PiecesLook, ThePageOfPieces) {
         QMetaObject::invokeMethod(cancel, "click");
     });
     walk.press(u"SpltForm"_s, u"Command2"_s);
-    const auto pick = [&](const QString& button, const QString& path) {
+    const auto pick = [&](const QString& button, const DrivePath& path) {
         walk.program().dialogs().nextPick = [path] { return path; };
         walk.press(u"SpltForm"_s, button);
     };
-    pick(u"Command2"_s, order + u"\\2026_11_21_KUP_1234^105.txt"_s);
+    pick(u"Command2"_s, order / u"2026_11_21_KUP_1234^105.txt");
     look(walk, u"72-pieces-to-cut"_s);
     walk.press(u"SpltForm"_s, u"Command3"_s);
     look(walk, u"73-pieces-cut"_s);
@@ -57,9 +57,9 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     look(walk, u"74-pieces-wrong-size"_s);
     walk.program().dialogs().closeMessages();
 
-    const QString pieces = order + u"\\meforakim"_s;
-    ASSERT_TRUE(files.removeFile(pieces + u"\\02 1015GNB0002_03AABB_jpp_001_002.prk"_s).ok());
-    pick(u"Command8"_s, pieces + u"\\01 1015GNB0001_03AABB_jpp_001_001.prk"_s);
+    const DrivePath pieces = order / u"meforakim";
+    ASSERT_TRUE(files.removeFile(pieces / u"02 1015GNB0002_03AABB_jpp_001_002.prk").ok());
+    pick(u"Command8"_s, pieces / u"01 1015GNB0001_03AABB_jpp_001_001.prk");
     auto& page = walk.page<SpltForm>(PageId::SpltForm);
     ASSERT_EQ(page.controls().List4Bodedim.count(), 6);
     const ControlFinder finder(walk.program().window());
@@ -67,7 +67,8 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     ASSERT_TRUE(finder.choose(u"SpltForm"_s, u"ListChalakim"_s, page.controls().ListChalakim.item(3)).ok());
     walk.press(u"SpltForm"_s, u"Command6"_s);
     EXPECT_EQ(page.controls().List4Bodedim.currentIndex(), 2);
-    EXPECT_EQ(page.controls().Label8.text, QString::number(*files.size(page.controls().ListChalakim.item(3))));
+    EXPECT_EQ(page.controls().Label8.text,
+              QString::number(*files.size(DrivePath(page.controls().ListChalakim.item(3)))));
     look(walk, u"75-pieces-families"_s);
     bool seen = false;
     QObject::connect(&page, &Page::changed, [&] {
@@ -80,7 +81,7 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     walk.press(u"SpltForm"_s, u"Command1"_s);
     EXPECT_TRUE(seen);
     look(walk, u"77-pieces-joined"_s);
-    EXPECT_EQ(files.names(pieces + u"\\moorkavim"_s, u"*"_s).size(), 5);
+    EXPECT_EQ(files.names(pieces / u"moorkavim", u"*"_s).size(), 5);
     walk.press(u"SpltForm"_s, u"Image3"_s);
     walk.waitFor(u"MoogMeret"_s);
 }

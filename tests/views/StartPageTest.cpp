@@ -60,7 +60,7 @@ protected:
     // An advertising picture that the lab's installation has placed.
     void placePicture(Walk& walk) {
         const HostPath folder =
-            *walk.program().platform().files.drives().toHost(walk.program().state().DiskRoot + u"lumora\\zmany"_s);
+            *walk.program().platform().files.drives().toHost(walk.program().state().DiskRoot / u"lumora\\zmany");
         std::filesystem::create_directories(folder);
         ASSERT_TRUE(writeSamplePhotographs(folder, 1, 0.2).ok());
         std::filesystem::rename(folder / "IMG_0001.jpg", folder / "ad01.jpg");

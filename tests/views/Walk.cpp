@@ -158,7 +158,7 @@ Walk::Walk(const Screen& screen, const QString& labSettings, Internet* line)
 
 Walk::~Walk() = default;
 
-QString Walk::pictureFolder() const {
+DrivePath Walk::pictureFolder() const {
     return m_program->platform().files.drives().toDrive(HostPath(m_folder.path().toStdString()) / "Pictures");
 }
 
@@ -228,7 +228,7 @@ void Walk::toPictures() {
 }
 
 void Walk::choosePictures() {
-    m_program->dialogs().nextPick = [this] { return pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    m_program->dialogs().nextPick = [this] { return pictureFolder() / u"IMG_0001.jpg"; };
     press(u"kyoskNew"_s, u"Image5"_s);
     m_program->dialogs().nextPick = {};
     settle(300);
@@ -267,7 +267,7 @@ void Walk::toEditor() {
     press(u"nnn"_s, u"Option1(0)"_s);
     press(u"nnn"_s, u"Option3(1)"_s);
     toPictures();
-    m_program->dialogs().nextPick = [this] { return pictureFolder() + u"\\IMG_0001.jpg"_s; };
+    m_program->dialogs().nextPick = [this] { return pictureFolder() / u"IMG_0001.jpg"; };
     press(u"kyoskNew"_s, u"Image5"_s);
     m_program->dialogs().nextPick = {};
     settle(300);

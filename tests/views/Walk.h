@@ -3,6 +3,7 @@
 #include "app/Program.h"
 #include "drive/ControlFinder.h"
 #include "session/Page.h"
+#include "support/DrivePathLiteral.h"
 
 #include <QSize>
 #include <QString>
@@ -30,7 +31,7 @@ public:
     ~Walk();
 
     Program& program() { return *m_program; }
-    QString pictureFolder() const; // drive path
+    DrivePath pictureFolder() const;
     template <class P>
     P& page(PageId id) {
         return static_cast<P&>(*find(id));

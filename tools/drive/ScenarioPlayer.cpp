@@ -2,7 +2,7 @@
 
 #include "app/Program.h"
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -264,24 +264,24 @@ ScenarioPlayer::Look ScenarioPlayer::shoot(const QString& name) const {
 ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
     const QFileInfo picked(hostPath);
     const Files& files = m_program.platform().files;
-    QString path = files.drives().toDrive(toHostPath(picked.canonicalFilePath()));
+    DrivePath path = files.drives().toDrive(toHostPath(picked.canonicalFilePath()));
     if (picked.isDir()) {
         const QStringList pictures = files.names(path, QStringLiteral("*.jpg;*.jpeg"));
         if (pictures.isEmpty())
             return {false, QStringLiteral("a picture in ") + hostPath, QStringLiteral("none")};
-        path = JoinDrivePath(path, pictures.front());
+        path = path / pictures.front();
     } else if (!picked.isFile()) {
         return {false, QStringLiteral("the file ") + hostPath, QStringLiteral("it does not exist")};
     }
-    m_picks += AnsiCodePage::squeeze(path);
+    m_picks += DrivePath(AnsiCodePage::squeeze(path.text()));
     return {true, {}, {}};
 }
 
-std::optional<QString> ScenarioPlayer::takePick() {
+std::optional<DrivePath> ScenarioPlayer::takePick() {
     if (!m_picks.isEmpty())
         return m_picks.takeFirst();
     fail(place(), QStringLiteral("no file dialog"), QStringLiteral("one, and no pick was prepared for it"));
-    return QString();
+    return DrivePath();
 }
 
 std::optional<bool> ScenarioPlayer::takeAnswer() {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "drive/ControlFinder.h"
 #include "drive/ScenarioFile.h"
 
@@ -58,7 +59,7 @@ private:
     Look dump(const ScenarioCommand& command) const;
     Look shoot(const QString& name) const;
     Look preparePick(const QString& hostPath);
-    std::optional<QString> takePick();
+    std::optional<DrivePath> takePick();
     std::optional<bool> takeAnswer();
 
     void moveOn();
@@ -80,7 +81,7 @@ private:
     bool m_goesOnInTheMiddle = false;
     bool m_finished = false;
     qsizetype m_messagesTaken = 0; // index in ScreenDialogs::shownTexts
-    QStringList m_picks;           // drive paths
+    QList<DrivePath> m_picks;
     QList<bool> m_answers;
     QString m_failure;
 };

@@ -1,7 +1,7 @@
 #include "assembly/edited/B3.h"
 
 #include "assembly/OrderSheet.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "editing/editor/gdisave.h"
 #include "imaging/files/BmpFile.h"
@@ -87,7 +87,7 @@ bool B3::prepareOrder() {
     List4fail.clear();
     m_writeFailures = 0;
     // Without the folder the sheet has no pictures, and that is all: the order goes on.
-    for (const QString& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
+    for (const DrivePath& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
         if (!m_platform.files.folderExists(path))
             static_cast<void>(m_platform.files.makeFolder(path));
     }
@@ -128,7 +128,7 @@ void B3::preparePicture(int index, PrintPacker& packer, EditedPrints& prints) {
     packer.beginStep();
     if (!line.hasUsableName())
         return;
-    Label4Picture.text = LeafName(line.path);
+    Label4Picture.text = line.path.leaf();
     Q_EMIT changed();
     if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
         saveThumbnail(line, packer.scratch());
@@ -154,17 +154,18 @@ Result<void> B3::keepToneCopy(const BasketLine& line, NewContent& copy) {
         return kept;
     if (edit.RedMarker != EditRecord::corrected)
         return {};
-    const QString path = WorkspacePaths::toneCopy(m_state);
+    const DrivePath path = WorkspacePaths::toneCopy(m_state);
     return m_platform.files.copyFile(path, WorkspacePaths::corrected(m_state, path));
 }
 
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
-void B3::saveThumbnail(const BasketLine& line, const QString& scratch) {
+void B3::saveThumbnail(const BasketLine& line, const DrivePath& scratch) {
     const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
-    const QString path =
-        m_jobFolder + u'\\' + line.copiesField() + u'~' + PrintBaseName(line.path) + QStringLiteral(".bmp");
+    const DrivePath path =
+        m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + QStringLiteral(".bmp"));
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
-    const Result<PictureSize> size = source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch};
+    const Result<PictureSize> size =
+        source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch.text()};
     if (!size || !target)
         return;
     const auto height = static_cast<int>(RoundHalfEven(static_cast<double>(previewWidth) * size->height / size->width));
@@ -173,7 +174,7 @@ void B3::saveThumbnail(const BasketLine& line, const QString& scratch) {
         return;
     Picture3 = *preview;
     Q_EMIT changed();
-    NewContent thumbnail(*target, path);
+    NewContent thumbnail(*target, path.text());
     appendBmp(Picture3, thumbnail, [] { return false; });
     static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
 }
@@ -190,7 +191,7 @@ bool B3::buildOrderSheet() {
     for (const QString& name : File1.names()) {
         // Twice the last four characters: of the ending and of the name itself.
         const QString caption = name.left(std::max<qsizetype>(0, name.size() - 8));
-        cells.push_back({m_platform.files.drives().toHost(m_jobFolder + u'\\' + name), caption});
+        cells.push_back({m_platform.files.drives().toHost(m_jobFolder / name), caption});
     }
     setStage(Stage::Sheet);
     sheet.drawContactSheet(cells, [&](int i) {

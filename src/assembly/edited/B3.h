@@ -57,11 +57,11 @@ private:
     void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
     Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
     Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
-    void saveThumbnail(const BasketLine& line, const QString& scratch);
+    void saveThumbnail(const BasketLine& line, const DrivePath& scratch);
     bool buildOrderSheet();
 
     std::optional<PaperSize> m_paper; // as it was when the page was loaded
-    QString m_jobFolder;
+    DrivePath m_jobFolder;
 };
 
 } // namespace lumora

@@ -52,12 +52,12 @@ EditedPrints::Ahead::Work EditedPrints::rendering(const BasketLine& item) const 
     EditFields edit;
     UnpackEditState(item.editState, edit);
     const Drives& drives = m_files.drives();
-    const QString source =
+    const DrivePath source =
         edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(m_state, item.path) : item.path;
-    const std::optional<HostPath> file = HasQuestionMark(source) ? std::nullopt : drives.toHost(source);
+    const std::optional<HostPath> file = HasQuestionMark(source.text()) ? std::nullopt : drives.toHost(source);
     const std::optional<HostPath> copy = drives.toHost(WorkspacePaths::toneCopy(m_state));
     if (!m_paper || !file || !copy)
-        return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source}}; };
+        return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source.text()}}; };
     EditedPrint print;
     print.file = *file;
     print.paper = *m_paper;

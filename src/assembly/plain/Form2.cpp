@@ -2,7 +2,6 @@
 
 #include "assembly/PaperResize.h"
 #include "assembly/WorkAhead.h"
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "order/BasketLine.h"
 #include "order/OrderFolder.h"
@@ -40,7 +39,7 @@ public:
     Prints(const SessionState& state, const Files& files, const QStringList& items)
         : m_files(files)
         , m_paper(PaperSize::ofText(state.shemot.ppr))
-        , m_sources(state.DchisaAmoka == 1 ? QStringList() : sourcesToScale(items))
+        , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items))
         , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
 
     // The print of the next picture that is to be scaled.
@@ -52,8 +51,8 @@ public:
 private:
     using Ahead = WorkAhead<Result<QByteArray>>;
 
-    static QStringList sourcesToScale(const QStringList& items) {
-        QStringList sources;
+    static QList<DrivePath> sourcesToScale(const QStringList& items) {
+        QList<DrivePath> sources;
         for (const QString& item : items) {
             const BasketLine picture = split(item);
             if (picture.hasUsableName() && !HasQuestionMark(item))
@@ -62,7 +61,7 @@ private:
         return sources;
     }
 
-    Ahead::Work scaling(const QString& path) const {
+    Ahead::Work scaling(const DrivePath& path) const {
         const std::optional<HostPath> source = m_files.drives().toHost(path);
         return [source, paper = m_paper]() -> Result<QByteArray> {
             if (!source || !paper)
@@ -73,7 +72,7 @@ private:
 
     const Files& m_files;
     const std::optional<PaperSize> m_paper;
-    const QStringList m_sources;
+    const QList<DrivePath> m_sources;
     Ahead m_prints;
 };
 
@@ -146,7 +145,7 @@ void Form2::prepare() {
     }
     const bool toFinishedOrders = m_state.TmunatPaar == 1 && m_state.Optint == OrderKind::Sequence;
     if (toFinishedOrders && m_chain.canFollow(id(), Outcome::PreparedForLater))
-        m_state.handOver.lines = {m_state.transfer.OrderLogBase};
+        m_state.handOver.lines = {m_state.transfer.OrderLogBase.text()};
     handOver(toFinishedOrders ? Outcome::PreparedForLater : Outcome::PreparedForFtp);
 }
 
@@ -171,7 +170,7 @@ void Form2::keepOnlyJpeg() {
     for (int i = 0; i < List1.count(); ++i) {
         if (isJpegItem(List1.item(i)))
             continue;
-        List4removed.append(split(List1.item(i)).path);
+        List4removed.append(split(List1.item(i)).path.text());
         List1.removeAt(i);
     }
     showProgress();
@@ -187,7 +186,7 @@ bool Form2::prepareOrder() {
     if (!drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain))
         return false;
 
-    const QString sheetPath =
+    const DrivePath sheetPath =
         folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, QStringLiteral(".jpp")));
     const Result<QByteArray> sheet = encodeJpeg(Picture5Image, printQuality);
     const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
@@ -214,7 +213,7 @@ void Form2::packPicture(int index, PrintPacker& packer, Prints& prints) {
         addFailed(line.path);
         return;
     }
-    Label4Picture.text = LeafName(line.path);
+    Label4Picture.text = line.path.leaf();
     Q_EMIT changed();
     pack(packer, {index, line.code, line.path}, [&] {
         return m_state.DchisaAmoka == 1 ? m_platform.files.read(line.path)
@@ -233,7 +232,7 @@ bool Form2::drawSheet(SheetKind kind) {
     std::vector<SheetCell> cells;
     for (const QString& item : List1.items())
         cells.push_back({m_platform.files.drives().toHost(split(item).path),
-                         split(item).copiesField() + u'_' + RightPart(NameWithoutEnding(item), 9)});
+                         split(item).copiesField() + u'_' + RightPart(split(item).path.stem(), 9)});
     setStage(Stage::Sheet);
     sheet.drawContactSheet(cells, [&](int i) {
         setStage(Stage::Sheet, i + 1);

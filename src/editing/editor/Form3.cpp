@@ -1,6 +1,6 @@
 #include "editing/editor/Form3.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "imaging/drawing/Drawing.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
@@ -67,7 +67,7 @@ void Form3::draw() {
 }
 
 Result<Bitmap> Form3::read() {
-    const std::optional<HostPath> file = m_platform.files.drives().toHost(Label1.text);
+    const std::optional<HostPath> file = m_platform.files.drives().toHost(DrivePath(Label1.text));
     if (!file)
         return Failure{Failure::Kind::NotFound, Label1.text};
     const auto size = readPictureSize(*file);

@@ -116,9 +116,9 @@ void gdisave::saveProof(const Bitmap& picture) {
         SaveJpeg(LitlPic, WorkspacePaths::proofPicture(m_state), 70);
 }
 
-bool gdisave::SaveJpeg(const Bitmap& picture, const QString& path, int quality) {
+bool gdisave::SaveJpeg(const Bitmap& picture, const DrivePath& path, int quality) {
     if (picture.isNull()) {
-        ShowGdiStatus(2, path);
+        ShowGdiStatus(2, path.text());
         return false;
     }
     if (!FindEncoderClsid(QStringLiteral("image/jpeg"))) {

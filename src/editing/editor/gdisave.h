@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "session/Caption.h"
@@ -49,7 +50,7 @@ public:
     void Command7_Click() { saveProof(LitlPic); }
 
     // Saves under a drive path; the quality is held within 0 to 100. A failure is shown and gives false.
-    bool SaveJpeg(const Bitmap& picture, const QString& path, int quality);
+    bool SaveJpeg(const Bitmap& picture, const DrivePath& path, int quality);
     // Shows a status that is not 0 in a box, with the path and reason behind it where they are known. Returns the
     // status.
     int ShowGdiStatus(int status, const QString& detail = {});
@@ -65,7 +66,7 @@ public:
     void Command4_Click();
     void Command8_Click();
     void Command9_Click();
-    Bitmap PictureFromFile(const QString& path); // null when the file can't be read; the failure is shown
+    Bitmap PictureFromFile(const DrivePath& path); // null when the file can't be read; the failure is shown
 
     // --- state ---
 

@@ -27,9 +27,9 @@ void gdisave::HScroll1_Change(int value) {
     setTexts();
 }
 
-Bitmap gdisave::PictureFromFile(const QString& path) {
+Bitmap gdisave::PictureFromFile(const DrivePath& path) {
     const std::optional<HostPath> host = m_platform.files.drives().toHost(path);
-    const Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path};
+    const Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path.text()};
     if (picture)
         return *picture;
     showFailure(picture.failure());

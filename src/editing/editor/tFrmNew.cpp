@@ -1,6 +1,5 @@
 #include "editing/editor/tFrmNew.h"
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
 #include "editing/editor/BigPics.h"
@@ -75,7 +74,7 @@ EditedPreview* tFrmNew::workPicture() const {
     return surfaces().workPicture();
 }
 
-HostPath tFrmNew::hostOf(const QString& path) const {
+HostPath tFrmNew::hostOf(const DrivePath& path) const {
     return m_platform.files.drives().toHost(path).value_or(HostPath());
 }
 
@@ -109,7 +108,7 @@ void tFrmNew::OpenPictureInEditor() {
 
     ResetEditorZoom();
     m_open = loadPictureOfRecord();
-    Title.text = m_open ? LeafName(edit().PicturePath) : QString();
+    Title.text = m_open ? edit().PicturePath.leaf() : QString();
     Picture3.visible = m_open;
     Image19.visible = !m_open;
     PlaceTextLabel();
@@ -133,7 +132,7 @@ bool tFrmNew::loadPictureOfRecord() {
     if (edit().RedMarker != EditRecord::corrected)
         return LoadWorkBitmap(edit().PicturePath);
     edit().TempRedName = MangleFileName(edit().PicturePath);
-    const QString copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
+    const DrivePath copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
     if (m_platform.files.fileExists(copy))
         return LoadWorkBitmap(copy);
     // The picture is then shown and printed without the correction.
@@ -141,11 +140,12 @@ bool tFrmNew::loadPictureOfRecord() {
     if (!LoadWorkBitmap(edit().PicturePath))
         return false;
     tell(QStringLiteral("תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"),
-         QStringLiteral("The red-eye correction of this picture was lost. It is shown and printed without it"), copy);
+         QStringLiteral("The red-eye correction of this picture was lost. It is shown and printed without it"),
+         copy.text());
     return true;
 }
 
-bool tFrmNew::LoadWorkBitmap(const QString& path) {
+bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
     const PaperSize paper = *PaperSize::ofDigits(PaperSizeCode);
     Result<EditedPreview> opened =
         EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
@@ -165,8 +165,7 @@ void tFrmNew::writeWorkFile() {
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
     workPicture()->workPicture().image().save(&buffer, "BMP");
-    const Result<void> written =
-        m_platform.files.writePassing(JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("0.bmp")), bytes);
+    const Result<void> written = m_platform.files.writePassing(WorkspacePaths::root(m_state) / u"0.bmp", bytes);
     // Editing needs no work file, so its failure is told once.
     if (!written && !m_workFileFailed)
         m_platform.dialogs.message(written.failure().message);
@@ -175,7 +174,7 @@ void tFrmNew::writeWorkFile() {
 
 void tFrmNew::pickAnotherPicture() {
     stopHolds();
-    const QString picture = m_platform.dialogs.pickFile(
+    const DrivePath picture = m_platform.dialogs.pickFile(
         m_state.wording(QStringLiteral("לחץ על תמונה אחת פעמיים וכל התמונות מהתיקייה תוצגנה "),
                         QStringLiteral("Double-click one picture and all the pictures of the folder will be shown")),
         m_state.DiskRoot,

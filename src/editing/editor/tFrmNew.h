@@ -162,7 +162,7 @@ Q_SIGNALS:
     // The customer goes back to the pictures.
     void left();
     // The customer picked a picture by its file, to see all pictures of its folder.
-    void picked(const QString& path);
+    void picked(const DrivePath& picture);
 
 private:
     enum class Held { Closer, Further, Darker, Lighter, Right, Left, Up, Down, TurnRight, TurnLeft };
@@ -239,10 +239,10 @@ private:
     EditFields& edit() const;
     BigPics& surfaces() const;
     EditedPreview* workPicture() const;
-    HostPath hostOf(const QString& path) const;
+    HostPath hostOf(const DrivePath& path) const;
     void tell(const QString& hebrew, const QString& english, const QString& reason) const;
     void OpenPictureInEditor();
-    bool LoadWorkBitmap(const QString& path);
+    bool LoadWorkBitmap(const DrivePath& path);
     bool loadPictureOfRecord();
     void writeWorkFile();
     void ResetEditorZoom();
@@ -281,7 +281,7 @@ private:
     // The frame that was drawn last, under its folder and name, so that a tick does not read it again.
     QString m_frameKey;
     std::optional<Bitmap> m_frame;
-    mutable std::map<QString, Bitmap> m_framePictures;
+    mutable std::map<QString, Bitmap> m_framePictures; // by path
 };
 
 } // namespace lumora

@@ -109,10 +109,10 @@ int tFrmNew::frameOnPicture() const {
 }
 
 Bitmap tFrmNew::framePicture(int index) const {
-    const QString path = index < 0 ? QString() : m_frames.listFile(Combo4.text, Combo2List.item(index));
+    const DrivePath path = index < 0 ? DrivePath() : m_frames.listFile(Combo4.text, Combo2List.item(index));
     if (path.isEmpty())
         return {};
-    const auto known = m_framePictures.find(path);
+    const auto known = m_framePictures.find(path.text());
     if (known != m_framePictures.end())
         return known->second;
     const HostPath host = hostOf(path);
@@ -121,7 +121,7 @@ Bitmap tFrmNew::framePicture(int index) const {
         if (Result<Bitmap> small = loadPictureScaled(host, smallPictureSize(*size, framePictureSize)))
             picture = std::move(*small);
     }
-    return m_framePictures[path] = picture;
+    return m_framePictures[path.text()] = picture;
 }
 
 // --- line frames: the record carries them to the lab, and nothing here draws them ---

@@ -1,6 +1,5 @@
 #include "editing/redeye/RedI.h"
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "editing/editor/tFrmNew.h"
 #include "editing/redeye/RedOverview.h"
@@ -54,7 +53,7 @@ void RedI::load() {
     showState();
 }
 
-void RedI::open(const QString& path) {
+void RedI::open(const DrivePath& path) {
     if (busy)
         return;
     stopHolds();
@@ -76,12 +75,12 @@ void RedI::open(const QString& path) {
     const Drives& drives = m_platform.files.drives();
     const std::optional<HostPath> host = drives.toHost(path);
     Result<Opened> opened = RunBlocking([&host, &path]() -> Result<Opened> {
-        Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path};
+        Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path.text()};
         if (!picture)
             return picture.failure();
         const Bitmap white = onWhite(*picture);
         if (white.isNull())
-            return Failure{Failure::Kind::TooLarge, path};
+            return Failure{Failure::Kind::TooLarge, path.text()};
         const PictureSize size = RedOverview::size({white.width(), white.height()});
         return Opened{white, RedOverview::draw(white, RedOverview::pixels(size)), size};
     });
@@ -92,10 +91,10 @@ void RedI::open(const QString& path) {
         close();
         return;
     }
-    caption = path;
+    caption = path.text();
     m_sight.open({opened->picture.width(), opened->picture.height()});
     static_cast<void>(Workspace(m_state, m_platform.files).MakeWorkspace()); // what failed is told when it is needed
-    const QString undoCopy = JoinDrivePath(WorkspacePaths::tempred(m_state), u"000.bmp"_s);
+    const DrivePath undoCopy = WorkspacePaths::tempred(m_state) / u"000.bmp";
     m_picture.begin(std::move(opened->picture), std::move(opened->overview), opened->overviewSize,
                     drives.toHost(undoCopy).value_or(HostPath()));
     setTexts();
@@ -263,13 +262,12 @@ Result<void> RedI::saveCorrected() {
     const Files& files = m_platform.files;
     if (const Result<void> made = Workspace(m_state, files).MakeWorkspace(); !made)
         return made;
-    if (const Result<void> made = files.makeFolder(JoinDrivePath(WorkspacePaths::jobFolder(m_state), u"red_folder"_s));
-        !made)
+    if (const Result<void> made = files.makeFolder(WorkspacePaths::jobFolder(m_state) / u"red_folder"); !made)
         return made;
-    const QString target = WorkspacePaths::corrected(m_state, caption);
+    const DrivePath target = WorkspacePaths::corrected(m_state, DrivePath(caption));
     const std::optional<HostPath> host = files.drives().toHost(target);
     if (!host)
-        return Failure{Failure::Kind::NotFound, target};
+        return Failure{Failure::Kind::NotFound, target.text()};
     waitFor(m_state.wording(u"התמונה המתוקנת נשמרת, רגע אחד…"_s, u"Saving the corrected picture, one moment…"_s));
     m_platform.pump.pump();
     const Result<void> saved = RunBlocking([this, &host] { return saveBmp(m_picture.Picture1, *host); });

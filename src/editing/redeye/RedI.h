@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "editing/HeldButton.h"
 #include "editing/editor/DragHandle.h"
 #include "editing/redeye/RedEyePicture.h"
@@ -34,7 +35,7 @@ public:
     // --- events ---
 
     // Shows the page and loads the picture (a drive path). One that can't be read is told, and the page closes.
-    void open(const QString& path);
+    void open(const DrivePath& path);
 
     // Moving about. Points of the overview are in shares of 1, all others in pixels of the picture.
     enum class Button { Left, Right };

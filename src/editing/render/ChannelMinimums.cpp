@@ -22,7 +22,7 @@ QString keyOf(char16_t channel, std::size_t index) {
 
 } // namespace
 
-Result<void> ChannelMinimums::readFrom(const Files& files, const QString& path) {
+Result<void> ChannelMinimums::readFrom(const Files& files, const DrivePath& path) {
     if (!files.fileExists(path))
         return {};
     const Result<QByteArray> bytes = files.read(path);
@@ -39,7 +39,7 @@ Result<void> ChannelMinimums::readFrom(const Files& files, const QString& path) 
     return {};
 }
 
-Result<void> ChannelMinimums::writeTo(const Files& files, const QString& path) const {
+Result<void> ChannelMinimums::writeTo(const Files& files, const DrivePath& path) const {
     ListOutput out;
     out.pair(QStringLiteral("00"), QStringLiteral("00"));
     for (const auto& [channel, values] : channels(*this)) {

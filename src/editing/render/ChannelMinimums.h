@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QString>
@@ -19,8 +20,8 @@ struct ChannelMinimums {
 
     // Sets the values of the keys in the file of a drive path, in any order. A value whose key the file lacks stays,
     // an unknown key is passed over, and a missing file is no failure.
-    Result<void> readFrom(const Files& files, const QString& path);
-    Result<void> writeTo(const Files& files, const QString& path) const;
+    Result<void> readFrom(const Files& files, const DrivePath& path);
+    Result<void> writeTo(const Files& files, const DrivePath& path) const;
 
     bool operator==(const ChannelMinimums&) const = default;
 };

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "common/DrivePath.h"
+
 #include <QString>
 #include <QStringList>
 
@@ -14,7 +16,7 @@ public:
     static constexpr int longestCategory = 10;
     static constexpr int longestName = 3;
 
-    FrameLists(const Files& files, QString folder)
+    FrameLists(const Files& files, DrivePath folder)
         : m_files(files)
         , m_folder(std::move(folder)) {}
 
@@ -24,12 +26,12 @@ public:
     enum class ListFile { Png, Bmp };
     QStringList names(const QString& category, ListFile kind) const;
 
-    // The drive path of the file that stands for a frame in the list; empty when there is none.
-    QString listFile(const QString& category, const QString& name) const;
+    // The file that stands for a frame in the list; empty when there is none.
+    DrivePath listFile(const QString& category, const QString& name) const;
 
 private:
     const Files& m_files;
-    QString m_folder;
+    DrivePath m_folder;
 };
 
 } // namespace lumora

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
-
-#include <QString>
 
 namespace lumora {
 
@@ -14,14 +13,14 @@ struct SessionState;
 // picture, named by its flat name, bitmap data whatever the name's ending says.
 namespace StoredSmallView {
 
-// The drive path of a picture's stored view.
-QString path(const SessionState& state, const QString& picturePath);
+// The path of a picture's stored view.
+DrivePath path(const SessionState& state, const DrivePath& picturePath);
 
 // Makes the folder when it is missing.
-Result<void> store(const SessionState& state, const Files& files, const QString& picturePath, const Bitmap& preview);
+Result<void> store(const SessionState& state, const Files& files, const DrivePath& picturePath, const Bitmap& preview);
 
 // Forgets the stored view, if there is one.
-void discard(const SessionState& state, const Files& files, const QString& picturePath);
+void discard(const SessionState& state, const Files& files, const DrivePath& picturePath);
 
 } // namespace StoredSmallView
 } // namespace lumora

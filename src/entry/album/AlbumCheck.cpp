@@ -1,6 +1,6 @@
 #include "entry/album/AlbumCheck.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "entry/album/AlbumChoices.h"
 #include "entry/details/DetailsCheck.h"
 #include "session/SessionState.h"

@@ -1,6 +1,6 @@
 #include "entry/album/AlbumPanels.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "entry/details/DetailStore.h"
 #include "entry/details/DetailsCheck.h"
 #include "platform/Dialogs.h"

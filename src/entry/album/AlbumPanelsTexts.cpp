@@ -1,6 +1,6 @@
 #include "entry/album/AlbumPanels.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "session/CaptionTexts.h"
 #include "session/lab/MailDomains.h"
 

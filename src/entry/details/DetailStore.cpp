@@ -1,7 +1,6 @@
 #include "entry/details/DetailStore.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
 #include "common/ListOutput.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
@@ -71,8 +70,8 @@ Result<void> DetailStore::forgetQuickDetails() const {
     return forget(quickStore);
 }
 
-QString DetailStore::path(const QString& name) const {
-    return JoinDrivePath(WorkspacePaths::root(m_state), name);
+DrivePath DetailStore::path(const QString& name) const {
+    return WorkspacePaths::root(m_state) / name;
 }
 
 // Splits at line ends alone, since a name may hold a single quote mark, as Hebrew abbreviations do.

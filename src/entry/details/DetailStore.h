@@ -45,7 +45,7 @@ public:
     Result<void> forgetQuickDetails() const;
 
 private:
-    QString path(const QString& name) const;
+    DrivePath path(const QString& name) const;
     Result<std::optional<QStringList>> lines(const QString& name) const;
     Result<void> forget(const QString& name) const;
 

@@ -1,6 +1,6 @@
 #include "entry/details/DetailsCheck.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "session/SessionState.h"
 
 namespace lumora {

@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-Result<QString> ReadVolumeSerial(const Volume& volume, const QString& driveRoot) {
+Result<QString> ReadVolumeSerial(const Volume& volume, const DrivePath& driveRoot) {
     const Result<std::int32_t> serial = volume.serial(driveRoot);
     if (!serial)
         return serial.failure();

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QString>
@@ -9,7 +10,7 @@ namespace lumora {
 class Volume;
 
 // The serial of the program's volume as signed 32-bit decimal text.
-Result<QString> ReadVolumeSerial(const Volume& volume, const QString& driveRoot);
+Result<QString> ReadVolumeSerial(const Volume& volume, const DrivePath& driveRoot);
 
 // Its last four characters, or all of a shorter one: how an order names the machine it comes from.
 QString volumeMark(const QString& volumeSerial);

@@ -1,6 +1,6 @@
 #include "entry/details/nnn.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "entry/details/TileMenu.h"
 #include "session/SessionState.h"
 

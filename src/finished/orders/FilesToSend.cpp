@@ -1,6 +1,5 @@
 #include "finished/orders/FilesToSend.h"
 
-#include "common/DrivePathText.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
@@ -10,7 +9,7 @@
 
 namespace lumora {
 
-void FilesToSend::setFolder(const QString& folder) {
+void FilesToSend::setFolder(const DrivePath& folder) {
     m_folder = folder;
     refresh();
 }
@@ -60,23 +59,23 @@ std::int16_t FilesToSend::familyCount() const {
 QStringList FilesToSend::markedPaths() const {
     QStringList paths = markedNames();
     for (QString& path : paths)
-        path = JoinDrivePath(m_folder, path);
+        path = (m_folder / path).text();
     return paths;
 }
 
 std::optional<QString> FilesToSend::unmarkedSheet() const {
     if (m_names.isEmpty() || isMarked(0) || !IsSheet(m_names.first()))
         return std::nullopt;
-    return JoinDrivePath(m_folder, m_names.first());
+    return (m_folder / m_names.first()).text();
 }
 
 QStringList FilesToSend::resendList() const {
-    const QString text = OrderFolder(m_folder).logPath();
+    const DrivePath log = OrderFolder(m_folder).logPath();
     QStringList list = markedPaths();
     // The log may be marked too; a name that is sent twice never counts as arrived twice.
-    list.removeAll(text);
-    if (m_files.fileExists(text))
-        list.prepend(text);
+    list.removeAll(log.text());
+    if (m_files.fileExists(log))
+        list.prepend(log.text());
     if (const auto sheet = unmarkedSheet(); sheet && !list.isEmpty())
         list.append(*sheet);
     return list;

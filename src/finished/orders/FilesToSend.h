@@ -19,11 +19,11 @@ public:
     explicit FilesToSend(const Files& files)
         : m_files(files) {}
 
-    void setFolder(const QString& folder);
+    void setFolder(const DrivePath& folder);
     void setPattern(const QString& patterns);
     void refresh();
 
-    const QString& folder() const { return m_folder; }
+    const DrivePath& folder() const { return m_folder; }
     // Leaf names that match any pattern, sorted without regard to case.
     const QStringList& names() const { return m_names; }
     bool isMarked(int index) const;
@@ -49,7 +49,7 @@ private:
     std::optional<QString> unmarkedSheet() const;
 
     const Files& m_files;
-    QString m_folder;
+    DrivePath m_folder;
     QString m_pattern = wholeFiles;
     QStringList m_names;
     std::vector<bool> m_marked;

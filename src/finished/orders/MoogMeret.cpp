@@ -1,6 +1,6 @@
 #include "finished/orders/MoogMeret.h"
 
-#include "common/DrivePathText.h"
+#include "common/FixedText.h"
 #include "finished/orders/UnreadableFolders.h"
 #include "imaging/files/PictureFile.h"
 #include "order/OrderDetailsReader.h"
@@ -83,7 +83,7 @@ void MoogMeret::load() {
     refreshOrders();
     // The order that the preparation hands over is picked.
     if (!handedOver.isEmpty())
-        pickOrder(List2.find(FolderOfPath(handedOver.first())));
+        pickOrder(List2.find(DrivePath(handedOver.first()).folder().text()));
 }
 
 void MoogMeret::enter(Phase phase) {
@@ -105,13 +105,13 @@ bool MoogMeret::mayAct() const {
 
 // Lists the files of the session's order, as the preparation left it.
 void MoogMeret::listOrderInHand() {
-    const QString& folder = m_state.transfer.OrderFolder;
+    const DrivePath& folder = m_state.transfer.OrderFolder;
     Label1.text = u"0"_s;
-    if (FolderOfPath(folder) != WorkspacePaths::orders(m_state) || !m_platform.files.folderExists(folder))
+    if (folder.folder() != WorkspacePaths::orders(m_state) || !m_platform.files.folderExists(folder))
         return;
     listFiles(folder);
     for (const QString& name : File1.items())
-        List1.append(JoinDrivePath(folder, name));
+        List1.append((folder / name).text());
     Label1.text = QString::number(File1.count());
     Q_EMIT changed();
 }
@@ -119,13 +119,13 @@ void MoogMeret::listOrderInHand() {
 void MoogMeret::refreshOrders() {
     if (!mayAct())
         return;
-    const QString orders = WorkspacePaths::orders(m_state) + u'\\';
+    const DrivePath orders = WorkspacePaths::orders(m_state) / u"";
     listFiles(m_state.DiskRoot);
     openFolder(orders);
     List2.clear();
     List3.clear();
     for (const QString& name : Dir1.items()) {
-        List2.append(JoinDrivePath(orders, name));
+        List2.append((orders / name).text());
         List3.append(name);
     }
     Picture1 = {};
@@ -135,14 +135,14 @@ void MoogMeret::refreshOrders() {
 }
 
 // Reads the files of the folder only when it is another one than before.
-void MoogMeret::openFolder(const QString& folder) {
+void MoogMeret::openFolder(const DrivePath& folder) {
     if (std::exchange(Dir1Path, folder) != folder)
         listFiles(folder);
     Dir1.clear();
     Dir1.append(m_platform.files.folders(folder));
 }
 
-void MoogMeret::listFiles(const QString& folder) {
+void MoogMeret::listFiles(const DrivePath& folder) {
     m_files.setFolder(folder);
     File1.clear();
     File1.append(m_files.names());
@@ -153,7 +153,7 @@ void MoogMeret::pickOrder(int index) {
         return;
     List3.setCurrentIndex(index);
     List2.setCurrentIndex(index);
-    const QString folder = List2.currentItem();
+    const DrivePath folder(List2.currentItem());
     m_state.transfer.OrderFolder = folder;
     // A later folder resets neither: the lab's people may send the print files of an order in pieces.
     if (TravelsInPieces(List3.currentItem())) {
@@ -167,7 +167,7 @@ void MoogMeret::pickOrder(int index) {
     markAll();
 }
 
-void MoogMeret::showOrder(const QString& folder) {
+void MoogMeret::showOrder(const DrivePath& folder) {
     Label1.text = QString::number(File1.count());
     Label4Reka.visible = File1.isEmpty();
     Label4Pieces.visible = m_state.transfer.Mefurak == Travel::Pieces;
@@ -181,11 +181,11 @@ void MoogMeret::showOrder(const QString& folder) {
     TellUnreadableFolders(m_state, m_platform.dialogs, unreadable);
 }
 
-OrderDetails MoogMeret::detailsOf(const QString& folder) const {
+OrderDetails MoogMeret::detailsOf(const DrivePath& folder) const {
     OrderDetails details;
-    const QString text = OrderFolder(folder).logPath();
-    if (m_platform.files.fileExists(text))
-        ReadResentDetails(m_platform.files, text, details);
+    const DrivePath log = OrderFolder(folder).logPath();
+    if (m_platform.files.fileExists(log))
+        ReadResentDetails(m_platform.files, log, details);
     return details;
 }
 
@@ -193,7 +193,7 @@ OrderDetails MoogMeret::detailsOf(const QString& folder) const {
 void MoogMeret::loadPreview() {
     Picture1 = {};
     HScroll1 = VScroll1 = {};
-    const auto path = m_platform.files.drives().toHost(JoinDrivePath(m_files.folder(), File1.item(0)));
+    const auto path = m_platform.files.drives().toHost(m_files.folder() / File1.item(0));
     if (File1.isEmpty() || !path)
         return;
     const auto size = readPictureSize(*path);

@@ -19,8 +19,8 @@ struct MoogMeretControls : Controls {
 
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // step one: the orders
     Caption Label4Shalav1{*this, u"Label4Shalav1"};
-    TextList Dir1{*this, u"Dir1"};                               // folders below Dir1Path
-    QString Dir1Path;                                            // drive path
+    TextList Dir1{*this, u"Dir1"}; // folders below Dir1Path
+    DrivePath Dir1Path;
     TextList List2{*this, u"List2"};                             // full paths of the order folders
     TextList List3{*this, u"List3"};                             // their leaf names
     Caption Label4Rek{*this, u"Label4Rek", Caption::At::Hidden}; // shown when there is no order
@@ -119,7 +119,7 @@ public:
     void Command12_Click();
     void Command13_Click();
     void Command20_Click();
-    void Dir1_Change(const QString& folder); // drive path
+    void Dir1_Change(const DrivePath& folder);
 
     // --- state ---
 
@@ -155,10 +155,10 @@ private:
 
     void refreshOrders();
     void listOrderInHand();
-    void openFolder(const QString& folder);
-    void listFiles(const QString& folder);
+    void openFolder(const DrivePath& folder);
+    void listFiles(const DrivePath& folder);
     void pickOrder(int index);
-    void showOrder(const QString& folder);
+    void showOrder(const DrivePath& folder);
     void showWhatIsMarked();
     void loadPreview();
     void scroll(Scroll& bar, int value);
@@ -186,7 +186,7 @@ private:
     void showWalk();
     void showOutcome();
     bool mailSetUp() const { return m_state.profile.mail.setUp(); }
-    OrderDetails detailsOf(const QString& folder) const;
+    OrderDetails detailsOf(const DrivePath& folder) const;
 
     SessionState& m_state;
     const Platform& m_platform;

@@ -1,5 +1,5 @@
 // The wording of the page of finished orders.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"
 #include "order/OrderNames.h"

@@ -20,7 +20,7 @@ void MoogMeret::Command20_Click() {
     listPackages();
 }
 
-void MoogMeret::Dir1_Change(const QString& folder) {
+void MoogMeret::Dir1_Change(const DrivePath& folder) {
     if (mayAct())
         openFolder(folder);
 }

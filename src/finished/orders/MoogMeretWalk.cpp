@@ -1,5 +1,5 @@
 // The mail packages of the page of finished orders, sent one after another.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
 #include "finished/orders/MoogMeret.h"
@@ -130,18 +130,18 @@ void MoogMeret::selectPackage(int index) {
 void MoogMeret::sendPackage(int index) {
     if (!mailSetUp())
         return;
-    const QString path = List1.item(index);
+    const DrivePath path(List1.item(index));
     m_walk.tell(index, PackageWalk::Fate::Sending);
     Label4Doar.text = m_state.wording(u"שולחים את המנה. נא להמתין."_s, u"Sending the package. Please wait."_s);
     Label4Doar.hint.clear();
     Q_EMIT changed();
-    const QString order = FolderOfPath(path);
-    const QString letter = MailLetter(m_state, detailsOf(order), LeafName(path), Label4Mana.text);
+    const DrivePath order = path.folder();
+    const QString letter = MailLetter(m_state, detailsOf(order), path.leaf(), Label4Mana.text);
     MailOutcome outcome;
     if (const auto file = m_platform.files.drives().toHost(path))
-        outcome = m_platform.mail.send(m_state.profile.mail, {LeafName(order), letter, *file});
+        outcome = m_platform.mail.send(m_state.profile.mail, {order.leaf(), letter, *file});
     else
-        outcome = {MailEnd::AttachmentMissing, path};
+        outcome = {MailEnd::AttachmentMissing, path.text()};
     m_walk.tell(index, outcome.end == MailEnd::Sent ? PackageWalk::Fate::Sent : PackageWalk::Fate::Failed);
     Label4Doar.text = MailResultText(MailResultCode(outcome.end), m_state.english()).trimmed();
     Label4Doar.hint = outcome.words;

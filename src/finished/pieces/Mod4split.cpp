@@ -1,6 +1,5 @@
 #include "finished/pieces/Mod4split.h"
 
-#include "common/DrivePathText.h"
 #include "common/FixedText.h"
 #include "common/HostFile.h"
 #include "order/PieceName.h"
@@ -22,6 +21,10 @@ Failure fault(Failure::Kind kind, const QString& path, const QString& reason) {
     return {kind, QStringLiteral("%1: %2").arg(path, reason)};
 }
 
+DrivePath beside(const DrivePath& piece, int sequence) {
+    return DrivePath(PieceBeside(piece.text(), sequence));
+}
+
 } // namespace
 
 std::optional<std::int32_t> SegmentSize(const QString& text) {
@@ -32,10 +35,10 @@ std::optional<std::int32_t> SegmentSize(const QString& text) {
     return size;
 }
 
-Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target target,
+Cut Mod4split::SplitFile(const DrivePath& path, const QString& segmentText, Target target,
                          const QString& extension) const {
     Cut cut;
-    cut.passedOver = path.right(3) != extension;
+    cut.passedOver = path.text().right(3) != extension;
     if (cut.passedOver)
         return cut;
     const auto refuse = [&cut](Failure failure) {
@@ -52,28 +55,29 @@ Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target
     const qint64 declared = *length / *segment + 1;
     // A piece's name has three digits for a number: more pieces could never be joined.
     if (declared > mostPieces)
-        return refuse(fault(Failure::Kind::TooLarge, path,
+        return refuse(fault(Failure::Kind::TooLarge, path.text(),
                             QStringLiteral("%1 pieces of %2 bytes; names have room for %3")
                                 .arg(declared)
                                 .arg(*segment)
                                 .arg(mostPieces)));
     cut.declared = static_cast<int>(declared);
     const QString total = PieceNumber(cut.declared);
-    const QString stem = PieceStem(LeafName(path));
+    const QString stem = PieceStem(path.leaf());
     const QString longest = stem + PieceTail(1, total);
     // A name that the drive shortens would lose the numbers at its end.
     if (ShortenedName(longest) != longest)
-        return refuse(fault(Failure::Kind::Unsupported, path, QStringLiteral("the name is too long for pieces")));
+        return refuse(
+            fault(Failure::Kind::Unsupported, path.text(), QStringLiteral("the name is too long for pieces")));
 
     const auto host = m_files.host(path);
     if (!host)
         return refuse(host.failure());
-    const auto source = openSource(*host, path);
+    const auto source = openSource(*host, path.text());
     if (!source)
         return refuse(source.failure());
-    cut.folder = ParentFolder(path);
+    cut.folder = path.parent();
     if (target == Target::Meforakim) {
-        cut.folder = JoinDrivePath(cut.folder, meforakim);
+        cut.folder = cut.folder / meforakim;
         if (const auto made = m_files.makeFolder(cut.folder); !made)
             return refuse(made.failure());
     }
@@ -82,7 +86,7 @@ Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target
             cut.stopped = true;
             return cut;
         }
-        const QString piece = JoinDrivePath(cut.folder, stem + PieceTail(cut.pieces + 1, total));
+        const DrivePath piece = cut.folder / (stem + PieceTail(cut.pieces + 1, total));
         const auto written = writePiece(piece, *source, std::min<qint64>(*segment, *length - offset), path);
         if (!written)
             return refuse(written.failure());
@@ -91,30 +95,30 @@ Cut Mod4split::SplitFile(const QString& path, const QString& segmentText, Target
     return cut;
 }
 
-Result<void> Mod4split::writePiece(const QString& path, const Descriptor& source, qint64 count,
-                                   const QString& sourcePath) const {
+Result<void> Mod4split::writePiece(const DrivePath& path, const Descriptor& source, qint64 count,
+                                   const DrivePath& sourcePath) const {
     const auto host = m_files.host(path);
     if (!host)
         return host.failure();
-    NewContent content(*host, path);
-    const auto taken = appendFrom(source, count, content, sourcePath);
+    NewContent content(*host, path.text());
+    const auto taken = appendFrom(source, count, content, sourcePath.text());
     if (!taken)
         return taken.failure();
     if (!content.failed() && *taken != count)
-        return fault(Failure::Kind::Damaged, sourcePath, QStringLiteral("the file became shorter meanwhile"));
+        return fault(Failure::Kind::Damaged, sourcePath.text(), QStringLiteral("the file became shorter meanwhile"));
     if (m_files.fileExists(path)) {
-        const auto old = openSource(*host, path);
+        const auto old = openSource(*host, path.text());
         if (!old)
             return old.failure();
-        if (const auto skipped = skipTo(*old, count, path); !skipped)
+        if (const auto skipped = skipTo(*old, count, path.text()); !skipped)
             return skipped.failure();
-        if (const auto tail = appendFrom(*old, toTheEnd, content, path); !tail)
+        if (const auto tail = appendFrom(*old, toTheEnd, content, path.text()); !tail)
             return tail.failure();
     }
     return content.commit();
 }
 
-Joined Mod4split::MergeFamily(const QString& piecePath) const {
+Joined Mod4split::MergeFamily(const DrivePath& piecePath) const {
     Joined joined;
     if (piecePath.isEmpty())
         return joined;
@@ -122,22 +126,22 @@ Joined Mod4split::MergeFamily(const QString& piecePath) const {
         joined.failure = std::move(failure);
         return joined;
     };
-    const auto name = JoinedName(LeafName(piecePath));
+    const auto name = JoinedName(piecePath.leaf());
     if (!name)
-        return refuse(fault(Failure::Kind::Unsupported, piecePath,
+        return refuse(fault(Failure::Kind::Unsupported, piecePath.text(),
                             QStringLiteral("no piece: the name is shorter than a name and \"_001_001.prk\"")));
-    const QString folder = JoinDrivePath(ParentFolder(piecePath), moorkavim);
+    const DrivePath folder = piecePath.parent() / moorkavim;
     // A family whose pieces were removed meanwhile must not leave an empty folder.
-    if (m_files.fileExists(PieceBeside(piecePath, 1))) {
+    if (m_files.fileExists(beside(piecePath, 1))) {
         if (const auto made = m_files.makeFolder(folder); !made)
             return refuse(made.failure());
     }
-    return JoinPieces(piecePath, JoinDrivePath(folder, *name));
+    return JoinPieces(piecePath, folder / *name);
 }
 
-Joined Mod4split::JoinPieces(const QString& piecePath, const QString& outputPath) const {
+Joined Mod4split::JoinPieces(const DrivePath& piecePath, const DrivePath& outputPath) const {
     Joined joined;
-    joined.declared = DeclaredTotal(piecePath);
+    joined.declared = DeclaredTotal(piecePath.text());
     const auto bytes = appendPieces(piecePath, outputPath, joined);
     if (!bytes) {
         joined.failure = bytes.failure();
@@ -149,30 +153,30 @@ Joined Mod4split::JoinPieces(const QString& piecePath, const QString& outputPath
     return joined;
 }
 
-Result<qint64> Mod4split::appendPieces(const QString& piecePath, const QString& outputPath, Joined& joined) const {
+Result<qint64> Mod4split::appendPieces(const DrivePath& piecePath, const DrivePath& outputPath, Joined& joined) const {
     int count = 0;
-    while (count < mostPieces && m_files.fileExists(PieceBeside(piecePath, count + 1)))
+    while (count < mostPieces && m_files.fileExists(beside(piecePath, count + 1)))
         ++count;
     if (count == 0)
-        return fault(Failure::Kind::NotFound, PieceBeside(piecePath, 1),
+        return fault(Failure::Kind::NotFound, beside(piecePath, 1).text(),
                      QStringLiteral("the first piece is not there"));
     const auto target = m_files.host(outputPath);
     if (!target)
         return target.failure();
-    NewContent content(*target, outputPath);
+    NewContent content(*target, outputPath.text());
     qint64 bytes = 0;
     for (int number = 1; number <= count && !content.failed(); ++number) {
         joined.stopped = !m_step(number - 1, count);
         if (joined.stopped)
             return 0;
-        const QString path = PieceBeside(piecePath, number);
+        const DrivePath path = beside(piecePath, number);
         const auto host = m_files.host(path);
         if (!host)
             return host.failure();
-        const auto piece = openSource(*host, path);
+        const auto piece = openSource(*host, path.text());
         if (!piece)
             return piece.failure();
-        const auto appended = appendFrom(*piece, toTheEnd, content, path);
+        const auto appended = appendFrom(*piece, toTheEnd, content, path.text());
         if (!appended)
             return appended.failure();
         bytes += *appended;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "session/TextList.h"
 
@@ -20,7 +21,7 @@ class Files;
 struct Cut {
     bool passedOver = false; // its name does not have the extension asked for
     bool stopped = false;
-    QString folder; // folder of the pieces
+    DrivePath folder; // folder of the pieces
     int pieces = 0;
     int declared = 0;
     std::optional<Failure> failure;
@@ -29,7 +30,7 @@ struct Cut {
 // The result of joining one family. After a failure or a stop the output file is as it was before.
 struct Joined {
     bool stopped = false;
-    QString file;
+    DrivePath file;
     int pieces = 0;   // pieces joined: up to the first gap in the numbers
     int declared = 0; // total declared by the given piece's name
     qint64 bytes = 0;
@@ -53,17 +54,17 @@ public:
     enum class Target { FolderOfSource, Meforakim };
     // Does nothing when path does not end in extension (three characters). An existing piece is overwritten from its
     // beginning and not cut short: the bytes behind the new ones stay, as the lab's tools expect.
-    Cut SplitFile(const QString& path, const QString& segmentText, Target target, const QString& extension) const;
+    Cut SplitFile(const DrivePath& path, const QString& segmentText, Target target, const QString& extension) const;
 
     // Writes into the folder moorkavim beside the piece.
-    Joined MergeFamily(const QString& piecePath) const;
+    Joined MergeFamily(const DrivePath& piecePath) const;
     // Joins the pieces on the disk from number 1 to the first gap; the total in their names is ignored.
-    Joined JoinPieces(const QString& piecePath, const QString& outputPath) const;
+    Joined JoinPieces(const DrivePath& piecePath, const DrivePath& outputPath) const;
 
 private:
-    Result<void> writePiece(const QString& path, const Descriptor& source, qint64 count,
-                            const QString& sourcePath) const;
-    Result<qint64> appendPieces(const QString& piecePath, const QString& outputPath, Joined& joined) const;
+    Result<void> writePiece(const DrivePath& path, const Descriptor& source, qint64 count,
+                            const DrivePath& sourcePath) const;
+    Result<qint64> appendPieces(const DrivePath& piecePath, const DrivePath& outputPath, Joined& joined) const;
 
     const Files& m_files;
     Step m_step;

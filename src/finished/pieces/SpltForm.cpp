@@ -1,6 +1,5 @@
 #include "finished/pieces/SpltForm.h"
 
-#include "common/DrivePathText.h"
 #include "finished/orders/UnreadableFolders.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -46,18 +45,18 @@ void SpltForm::enter(Phase phase) {
 
 // --- what is cut and joined ---
 
-QString SpltForm::pickFile() {
+DrivePath SpltForm::pickFile() {
     if (m_folder.isEmpty())
         m_folder = WorkspacePaths::orders(m_state);
     const QString prompt = wording(u"בחר תמונה אחת בלבד "_s, u"Choose one picture only "_s);
-    const QString path = m_platform.dialogs.pickFile(prompt, m_folder, prompt, Dialogs::Offer::EveryFile);
+    const DrivePath path = m_platform.dialogs.pickFile(prompt, m_folder, prompt, Dialogs::Offer::EveryFile);
     if (!path.isEmpty())
-        m_folder = ParentFolder(path);
+        m_folder = path.parent();
     return path;
 }
 
 // A folder that can't be read is named in a box; the others are listed.
-QStringList SpltForm::collect(const QString& folder, Files::Depth depth) {
+QStringList SpltForm::collect(const DrivePath& folder, Files::Depth depth) {
     QStringList unreadable;
     const QStringList files = m_platform.files.collect(folder, depth, &unreadable);
     TellUnreadableFolders(m_state, m_platform.dialogs, unreadable);
@@ -106,12 +105,12 @@ void SpltForm::choosePiece(int index) {
 }
 
 void SpltForm::showLengthOfChosen() {
-    const QString path = ListChalakim.currentItem();
+    const DrivePath path(ListChalakim.currentItem());
     if (m_phase == Phase::Working || path.isEmpty())
         return;
     const auto size = m_platform.files.size(path);
     Label8.text = size ? QString::number(*size) : QString();
-    Label9.text = path.left(2);
+    Label9.text = path.text().left(2);
     showCounts();
     if (!size)
         m_platform.dialogs.message(reason(size.failure()));
@@ -125,9 +124,9 @@ void SpltForm::cutAll() {
         return;
     begin();
     Tally tally;
-    QString where;
+    DrivePath where;
     for (int i = 0; i < List4files.count() && !m_stop; ++i) {
-        const QString path = List4files.item(i);
+        const DrivePath path(List4files.item(i));
         if (path.isEmpty())
             break;
         workOn(path, i, List4files.count());
@@ -154,7 +153,7 @@ void SpltForm::cutAll() {
 void SpltForm::cutOne() {
     if (m_phase == Phase::Working || !segmentIsRight())
         return;
-    const QString path = pickFile();
+    const DrivePath path = pickFile();
     if (path.isEmpty())
         return;
     begin();
@@ -163,18 +162,18 @@ void SpltForm::cutOne() {
     const QString total =
         result.passedOver
             ? wording(u"%1 אינו מסתיים ב-prk ולכן לא נחתך."_s, u"%1 does not end in prk and was not cut."_s)
-                  .arg(LeafName(path))
+                  .arg(path.leaf())
             : (result.failure || result.stopped
                    ? wording(u"%1 לא נחתך עד הסוף. חלקים: %2."_s, u"%1 was not cut to its end. Pieces: %2."_s)
                    : wording(u"%1 נחתך. חלקים: %2."_s, u"%1 was cut. Pieces: %2."_s))
-                  .arg(LeafName(path), QString::number(result.pieces));
+                  .arg(path.leaf(), QString::number(result.pieces));
     end(result.failure                        ? Phase::Failed
         : result.passedOver || result.stopped ? Phase::Partly
                                               : Phase::Good,
-        total, result.pieces > 0 ? result.folder : QString());
+        total, result.pieces > 0 ? result.folder : DrivePath());
 }
 
-Cut SpltForm::cut(const QString& path, const QString& extension) {
+Cut SpltForm::cut(const DrivePath& path, const QString& extension) {
     const Cut result = m_pieces.SplitFile(path, Text2.text, Mod4split::Target::Meforakim, extension);
     if (result.failure)
         m_troubles += notCut(path, result);
@@ -196,10 +195,10 @@ void SpltForm::joinAll() {
         return;
     begin();
     Tally tally;
-    QString where;
+    DrivePath where;
     for (int i = 0; i < List4Bodedim.count() && !m_stop; ++i) {
         List4Bodedim.setCurrentIndex(i);
-        workOn(List4Bodedim.item(i), i, List4Bodedim.count());
+        workOn(DrivePath(List4Bodedim.item(i)), i, List4Bodedim.count());
         if (CollectFamily(List4Bodedim, ListChalakim, List4Famely) != familyComplete) {
             ++tally.passedOver;
             continue;
@@ -210,7 +209,7 @@ void SpltForm::joinAll() {
         else if (!result.stopped)
             ++tally.done;
         if (!result.file.isEmpty())
-            where = ParentFolder(result.file);
+            where = result.file.parent();
         if (result.failure && result.failure->kind == Failure::Kind::NoSpace)
             break;
     }
@@ -226,25 +225,25 @@ void SpltForm::joinChosen() {
     if (m_phase == Phase::Working || index < 0)
         return;
     begin();
-    workOn(List4Bodedim.currentItem(), 0, 1);
+    workOn(DrivePath(List4Bodedim.currentItem()), 0, 1);
     const Joined result = join(index);
     if (result.failure || result.stopped) {
         end(result.failure ? Phase::Failed : Phase::Partly, wording(u"לא צורף קובץ."_s, u"No file was joined."_s), {});
         return;
     }
     QString total = wording(u"%1 צורף. חלקים: %2, בתים: %3."_s, u"%1 was joined. Pieces: %2, bytes: %3."_s)
-                        .arg(LeafName(result.file), QString::number(result.pieces), QString::number(result.bytes));
+                        .arg(result.file.leaf(), QString::number(result.pieces), QString::number(result.bytes));
     // When a file's size is an exact multiple of the piece size, its pieces declare one piece too many. So the names do
     // not tell whether this file is whole.
     if (result.pieces != result.declared)
         total += wording(u" בשם רשומים %1 חלקים: יש לבדוק שהקובץ שלם."_s,
                          u" The name declares %1: check that the file is whole."_s)
                      .arg(result.declared);
-    end(result.pieces == result.declared ? Phase::Good : Phase::Partly, total, ParentFolder(result.file));
+    end(result.pieces == result.declared ? Phase::Good : Phase::Partly, total, result.file.parent());
 }
 
 Joined SpltForm::join(int index) {
-    const QString path = List4Bodedim.item(index);
+    const DrivePath path(List4Bodedim.item(index));
     const Joined result = m_pieces.MergeFamily(path);
     Fate& fate = m_fates.at(static_cast<std::size_t>(index));
     if (result.failure) {
@@ -265,10 +264,10 @@ void SpltForm::begin() {
     enter(Phase::Working);
 }
 
-void SpltForm::workOn(const QString& path, int index, int count) {
+void SpltForm::workOn(const DrivePath& path, int index, int count) {
     m_index = index;
     m_count = count;
-    Label4Work.text = wording(u"%1 מתוך %2: %3"_s, u"%1 of %2: %3"_s).arg(index + 1).arg(count).arg(LeafName(path));
+    Label4Work.text = wording(u"%1 מתוך %2: %3"_s, u"%1 of %2: %3"_s).arg(index + 1).arg(count).arg(path.leaf());
     Q_EMIT changed();
 }
 
@@ -281,10 +280,10 @@ bool SpltForm::step(int done, int total) {
     return !m_stop;
 }
 
-void SpltForm::end(Phase result, const QString& total, const QString& where) {
+void SpltForm::end(Phase result, const QString& total, const DrivePath& where) {
     enter(result);
     Label4Total.text = (m_stop ? wording(u"העבודה נעצרה. "_s, u"The work was stopped. "_s) : QString()) + total;
-    Label4Where.text = where;
+    Label4Where.text = where.text();
     tellTroubles();
     if (m_leaving && !m_chain.hasEnded())
         leave();

@@ -113,25 +113,25 @@ private:
     void goBack();
     void leave();
 
-    QString pickFile();
-    QStringList collect(const QString& folder, Files::Depth depth);
+    DrivePath pickFile();
+    QStringList collect(const DrivePath& folder, Files::Depth depth);
     bool segmentIsRight();
-    Cut cut(const QString& path, const QString& extension);
+    Cut cut(const DrivePath& path, const QString& extension);
     Joined join(int index);
 
     void enter(Phase phase);
     void begin();
-    void workOn(const QString& path, int index, int count);
+    void workOn(const DrivePath& path, int index, int count);
     bool step(int done, int total);
-    void end(Phase result, const QString& total, const QString& where);
+    void end(Phase result, const QString& total, const DrivePath& where);
     void tellTroubles();
 
     QString wording(const QString& hebrew, const QString& english) const;
     void showCounts();
     QString cutTotal(const Tally& tally) const;
     QString joinTotal(const Tally& tally) const;
-    QString notCut(const QString& path, const Cut& result) const;
-    QString notJoined(const QString& path, const Failure& failure) const;
+    QString notCut(const DrivePath& path, const Cut& result) const;
+    QString notJoined(const DrivePath& path, const Failure& failure) const;
     QString reason(const Failure& failure) const;
 
     SessionState& m_state;
@@ -141,8 +141,8 @@ private:
     std::vector<PieceFamily> m_families; // one for each entry of List4Bodedim
     std::vector<Fate> m_fates;
     Phase m_phase = Phase::Idle;
-    QString m_folder; // folder of the last picked file
-    int m_index = 0;  // index of the present file or family
+    DrivePath m_folder; // folder of the last picked file
+    int m_index = 0;    // index of the present file or family
     int m_count = 0;
     int m_percent = 0;
     QStringList m_troubles; // failures of the present work

@@ -1,5 +1,5 @@
 // The wording of the page of pieces.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "finished/pieces/SpltForm.h"
 #include "order/PieceName.h"
 #include "session/CaptionTexts.h"
@@ -102,21 +102,21 @@ QString SpltForm::joinTotal(const Tally& tally) const {
     return total;
 }
 
-QString SpltForm::notCut(const QString& path, const Cut& result) const {
+QString SpltForm::notCut(const DrivePath& path, const Cut& result) const {
     const QString written = result.pieces == 0 ? wording(u"לא נכתב אף חלק"_s, u"No piece was written"_s)
                                                : wording(u"חלקים שנכתבו: %1 מתוך %2"_s, u"Pieces written: %1 of %2"_s)
                                                      .arg(result.pieces)
                                                      .arg(result.declared);
     return wording(u"%1 לא נחתך עד הסוף. %2; הקובץ עצמו לא השתנה."_s,
                    u"%1 was not cut to its end. %2; the file itself is as it was."_s)
-               .arg(LeafName(path), written) +
+               .arg(path.leaf(), written) +
            u'\n' + reason(*result.failure);
 }
 
-QString SpltForm::notJoined(const QString& path, const Failure& failure) const {
+QString SpltForm::notJoined(const DrivePath& path, const Failure& failure) const {
     return wording(u"%1 לא צורף. החלקים לא השתנו, ולא נותר קובץ חלקי."_s,
                    u"%1 was not joined. The pieces are as they were, and no half file is left."_s)
-               .arg(LeafName(path)) +
+               .arg(path.leaf()) +
            u'\n' + reason(failure);
 }
 

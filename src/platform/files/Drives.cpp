@@ -89,8 +89,8 @@ HostPath Drives::defaultDataFolder() {
     return base / "lumora" / "drive_c";
 }
 
-QString Drives::programRoot() const {
-    return QString(m_programLetter) + QStringLiteral(":\\");
+DrivePath Drives::programRoot() const {
+    return DrivePath(QString(m_programLetter) + QStringLiteral(":\\"));
 }
 
 void Drives::refreshMedia() {
@@ -151,7 +151,8 @@ std::vector<Drives::Drive> Drives::drives() const {
     return all;
 }
 
-std::optional<HostPath> Drives::toHost(const QString& drivePath) const {
+std::optional<HostPath> Drives::toHost(const DrivePath& path) const {
+    const QString& drivePath = path.text();
     if (drivePath.size() < 2 || drivePath[1] != u':' || drivePath.contains(QChar(u'\0')))
         return std::nullopt;
     const QChar letter = drivePath[0].toUpper();
@@ -185,7 +186,7 @@ std::optional<HostPath> Drives::toHost(const QString& drivePath) const {
     return folder;
 }
 
-QString Drives::toDrive(const HostPath& hostPath) const {
+DrivePath Drives::toDrive(const HostPath& hostPath) const {
     const HostPath path = normal(hostPath);
     QChar letter = rootLetter;
     std::vector<HostPath> names(path.begin(), path.end());
@@ -198,13 +199,10 @@ QString Drives::toDrive(const HostPath& hostPath) const {
             names = std::move(*inside);
         }
     }
-    QString text = QString(letter) + QStringLiteral(":\\");
-    for (std::size_t i = 0; i < names.size(); ++i) {
-        if (i > 0)
-            text += u'\\';
-        text += toDriveName(names[i]);
-    }
-    return text;
+    DrivePath drivePath(QString(letter) + QStringLiteral(":\\"));
+    for (const HostPath& name : names)
+        drivePath = drivePath / toDriveName(name);
+    return drivePath;
 }
 
 QString ShortenedName(const QString& name) {

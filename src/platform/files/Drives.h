@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "platform/files/HostPath.h"
 
 #include <QChar>
@@ -29,7 +30,7 @@ public:
 
     QChar programLetter() const { return m_programLetter; }
     // As "C:\": the root of all workspace paths.
-    QString programRoot() const;
+    DrivePath programRoot() const;
     const HostPath& dataFolder() const { return m_dataFolder; }
 
     // Looks for media that were mounted or removed since the last call.
@@ -46,11 +47,11 @@ public:
 
     // No value for a text without a drive letter, for a letter without a folder, and for a path that leaves its drive
     // by "..". A long leaf name is shortened as by ShortenedName.
-    std::optional<HostPath> toHost(const QString& drivePath) const;
+    std::optional<HostPath> toHost(const DrivePath& path) const;
 
     // The drive path below the deepest folder that has a letter; Z: for a path below no other. A name that is not UTF-8
     // comes back from toHost unchanged.
-    QString toDrive(const HostPath& hostPath) const;
+    DrivePath toDrive(const HostPath& hostPath) const;
 
 private:
     HostPath m_dataFolder;

@@ -16,8 +16,8 @@ namespace {
 // No file of the program comes near; a larger one is an error.
 constexpr qint64 largestRead = qint64(1) << 30;
 
-Failure failure(Failure::Kind kind, const QString& path, const QString& reason) {
-    return {kind, QStringLiteral("%1: %2").arg(path, reason)};
+Failure failure(Failure::Kind kind, const DrivePath& path, const QString& reason) {
+    return {kind, QStringLiteral("%1: %2").arg(path.text(), reason)};
 }
 
 // In a pattern "*" stands for any characters, "?" for one.
@@ -78,65 +78,65 @@ QStringList entries(const HostPath& folder, Wanted wanted) {
     return entries(folder, wanted, passedOver);
 }
 
-void collectInto(QStringList& all, const HostPath& folder, const QString& shown, Files::Depth depth,
+void collectInto(QStringList& all, const HostPath& folder, const DrivePath& shown, Files::Depth depth,
                  QStringList* unreadable) {
     std::error_code error;
     const QStringList files = entries(folder, Wanted::Files, error);
     if (error && unreadable)
-        *unreadable += systemFailure(error.value(), shown).message;
+        *unreadable += systemFailure(error.value(), shown.text()).message;
     for (const QString& name : files)
-        all += shown + u'\\' + AnsiCodePage::squeeze(name);
+        all += (shown / AnsiCodePage::squeeze(name)).text();
     if (depth == Files::Depth::ThisFolder)
         return;
     for (const QString& name : entries(folder, Wanted::Folders)) {
         const HostPath sub = folder / toHostPath(name);
         // A link may lead back to a folder above, and the walk would not end.
         if (!fs::is_symlink(sub))
-            collectInto(all, sub, shown + u'\\' + AnsiCodePage::squeeze(name), depth, unreadable);
+            collectInto(all, sub, shown / AnsiCodePage::squeeze(name), depth, unreadable);
     }
 }
 
-Result<void> write(const Result<HostPath>& host, const QString& path, const QByteArray& bytes,
+Result<void> write(const Result<HostPath>& host, const DrivePath& path, const QByteArray& bytes,
                    NewContent::Durability durability) {
     if (!host)
         return host.failure();
-    NewContent content(*host, path);
+    NewContent content(*host, path.text());
     content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
     return content.commit(durability);
 }
 
 } // namespace
 
-Result<HostPath> Files::host(const QString& path) const {
-    if (path.contains(u'?'))
+Result<HostPath> Files::host(const DrivePath& path) const {
+    if (path.text().contains(u'?'))
         return failure(Failure::Kind::NotFound, path, QStringLiteral("the name holds a \"?\""));
     if (auto found = m_drives.toHost(path))
         return *found;
     return failure(Failure::Kind::NotFound, path, QStringLiteral("no such drive or path"));
 }
 
-bool Files::fileExists(const QString& path) const {
+bool Files::fileExists(const DrivePath& path) const {
     const auto found = host(path);
     std::error_code error;
     return found && fs::is_regular_file(*found, error);
 }
 
-bool Files::folderExists(const QString& path) const {
+bool Files::folderExists(const DrivePath& path) const {
     const auto found = host(path);
     std::error_code error;
     return found && fs::is_directory(*found, error);
 }
 
-Result<void> Files::makeFolder(const QString& path) const {
+Result<void> Files::makeFolder(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
     if (::mkdir(found->c_str(), 0700) == 0 || (errno == EEXIST && folderExists(path)))
         return {};
-    return systemFailure(errno, path);
+    return systemFailure(errno, path.text());
 }
 
-Result<bool> Files::makeNewFolder(const QString& path) const {
+Result<bool> Files::makeNewFolder(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
@@ -144,63 +144,63 @@ Result<bool> Files::makeNewFolder(const QString& path) const {
         return true;
     if (errno == EEXIST)
         return false;
-    return systemFailure(errno, path);
+    return systemFailure(errno, path.text());
 }
 
-Result<void> Files::removeFile(const QString& path) const {
+Result<void> Files::removeFile(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
     if (::unlink(found->c_str()) != 0)
-        return systemFailure(errno, path);
+        return systemFailure(errno, path.text());
     return {};
 }
 
-Result<QByteArray> Files::read(const QString& path) const {
+Result<QByteArray> Files::read(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
-    return readWholeFile(*found, path, largestRead);
+    return readWholeFile(*found, path.text(), largestRead);
 }
 
-Result<void> Files::writeWhole(const QString& path, const QByteArray& bytes) const {
+Result<void> Files::writeWhole(const DrivePath& path, const QByteArray& bytes) const {
     return write(host(path), path, bytes, NewContent::Durability::Synced);
 }
 
-Result<void> Files::writePassing(const QString& path, const QByteArray& bytes) const {
+Result<void> Files::writePassing(const DrivePath& path, const QByteArray& bytes) const {
     return write(host(path), path, bytes, NewContent::Durability::Passing);
 }
 
-Result<void> Files::copyFile(const QString& source, const QString& target) const {
+Result<void> Files::copyFile(const DrivePath& source, const DrivePath& target) const {
     const auto from = host(source);
     if (!from)
         return from.failure();
     const auto to = host(target);
     if (!to)
         return to.failure();
-    const auto opened = openSource(*from, source);
+    const auto opened = openSource(*from, source.text());
     if (!opened)
         return opened.failure();
-    NewContent content(*to, target);
-    const auto copied = appendFrom(*opened, toTheEnd, content, source);
+    NewContent content(*to, target.text());
+    const auto copied = appendFrom(*opened, toTheEnd, content, source.text());
     if (!copied)
         return copied.failure();
     return content.commit();
 }
 
-Result<qint64> Files::size(const QString& path) const {
+Result<qint64> Files::size(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
         return found.failure();
     struct stat status {};
     if (::stat(found->c_str(), &status) != 0)
-        return systemFailure(errno, path);
+        return systemFailure(errno, path.text());
     if (!S_ISREG(status.st_mode))
         return failure(Failure::Kind::Unsupported, path, QStringLiteral("not a file"));
     return static_cast<qint64>(status.st_size);
 }
 
-QStringList Files::names(const QString& folder, const QString& patterns) const {
+QStringList Files::names(const DrivePath& folder, const QString& patterns) const {
     QStringList wanted;
     for (const QString& pattern : patterns.split(u';', Qt::SkipEmptyParts))
         wanted += pattern.trimmed();
@@ -215,7 +215,7 @@ QStringList Files::names(const QString& folder, const QString& patterns) const {
     return names;
 }
 
-QStringList Files::folders(const QString& folder) const {
+QStringList Files::folders(const DrivePath& folder) const {
     const auto found = host(folder);
     QStringList names;
     if (!found)
@@ -225,17 +225,17 @@ QStringList Files::folders(const QString& folder) const {
     return names;
 }
 
-QStringList Files::collect(const QString& folder, Depth depth, QStringList* unreadable) const {
+QStringList Files::collect(const DrivePath& folder, Depth depth, QStringList* unreadable) const {
     const auto found = host(folder);
     QStringList all;
     if (found)
-        collectInto(all, *found, folder.endsWith(u'\\') ? folder.chopped(1) : folder, depth, unreadable);
+        collectInto(all, *found, folder, depth, unreadable);
     else if (unreadable)
         *unreadable += found.failure().message;
     return all;
 }
 
-void FileList::setFolder(const QString& folder) {
+void FileList::setFolder(const DrivePath& folder) {
     m_folder = folder;
     refresh();
 }

@@ -19,44 +19,44 @@ public:
     const Drives& drives() const { return m_drives; }
 
     // A path with "?" counts as absent in all calls: "?" replaces a character outside the code page.
-    bool fileExists(const QString& path) const;
-    bool folderExists(const QString& path) const;
+    bool fileExists(const DrivePath& path) const;
+    bool folderExists(const DrivePath& path) const;
 
     // Succeeds when the folder exists. The parent must exist.
-    Result<void> makeFolder(const QString& path) const;
+    Result<void> makeFolder(const DrivePath& path) const;
     // True if this call made it, false if something of that name is there: of two programs one alone gets the true.
-    Result<bool> makeNewFolder(const QString& path) const;
-    Result<void> removeFile(const QString& path) const;
+    Result<bool> makeNewFolder(const DrivePath& path) const;
+    Result<void> removeFile(const DrivePath& path) const;
 
-    Result<QByteArray> read(const QString& path) const;
+    Result<QByteArray> read(const DrivePath& path) const;
 
     // Writes a temporary file in the same folder, syncs and renames it: after a crash or on a full disk the path holds
     // the old file or the new one, never part of one.
-    Result<void> writeWhole(const QString& path, const QByteArray& bytes) const;
+    Result<void> writeWhole(const DrivePath& path, const QByteArray& bytes) const;
 
     // The same without the sync, for files written at every touch that are not needed after a crash of the machine.
-    Result<void> writePassing(const QString& path, const QByteArray& bytes) const;
+    Result<void> writePassing(const DrivePath& path, const QByteArray& bytes) const;
 
     // Copies by the same way. The source is opened for reading only.
-    Result<void> copyFile(const QString& source, const QString& target) const;
+    Result<void> copyFile(const DrivePath& source, const DrivePath& target) const;
 
-    Result<qint64> size(const QString& path) const;
+    Result<qint64> size(const DrivePath& path) const;
 
     // Leaf names of the files that match one of the patterns, separated by ";" ("*.gbr;*.jpp"); "*.*" and "*" match
     // all. Letter case does not count. Hidden files (a leading dot) and folders are left out. Sorted without regard to
     // case, "!" before digits before letters. A character outside the code page is "?". Empty when the folder can't be
     // read.
-    QStringList names(const QString& folder, const QString& patterns) const;
+    QStringList names(const DrivePath& folder, const QString& patterns) const;
 
     // Leaf names of the sub-folders, sorted likewise.
-    QStringList folders(const QString& folder) const;
+    QStringList folders(const DrivePath& folder) const;
 
     // folder + "\" + name for each file. Folders that can't be read are skipped and appended to unreadable, if given.
     enum class Depth { ThisFolder, WithSubfolders };
-    QStringList collect(const QString& folder, Depth depth, QStringList* unreadable = nullptr) const;
+    QStringList collect(const DrivePath& folder, Depth depth, QStringList* unreadable = nullptr) const;
 
     // The path on this machine, for reading or writing parts of a file.
-    Result<HostPath> host(const QString& path) const;
+    Result<HostPath> host(const DrivePath& path) const;
 
 private:
     const Drives& m_drives;
@@ -70,18 +70,18 @@ public:
         : m_files(files)
         , m_pattern(std::move(pattern)) {}
 
-    void setFolder(const QString& folder);
+    void setFolder(const DrivePath& folder);
     void setPattern(const QString& patterns);
     void refresh();
 
-    const QString& folder() const { return m_folder; }
+    const DrivePath& folder() const { return m_folder; }
     int count() const { return static_cast<int>(m_names.size()); }
     QString name(int index) const { return m_names.value(index); }
     const QStringList& names() const { return m_names; }
 
 private:
     const Files& m_files;
-    QString m_folder;
+    DrivePath m_folder;
     QString m_pattern;
     QStringList m_names;
 };

@@ -42,7 +42,7 @@ bool keepMark(const HostPath& file, const FolderMark& mark) {
 
 } // namespace
 
-Result<std::int32_t> MarkedVolume::serial(const QString& driveRoot) const {
+Result<std::int32_t> MarkedVolume::serial(const DrivePath& driveRoot) const {
     Result<std::int32_t> plain = m_volume.serial(driveRoot);
     if (!plain)
         return plain;

@@ -18,7 +18,7 @@ public:
         , m_file(std::move(dataFolder) / ".lumora-mark")
         , m_cards(std::move(networkCards)) {}
 
-    Result<std::int32_t> serial(const QString& driveRoot) const override;
+    Result<std::int32_t> serial(const DrivePath& driveRoot) const override;
 
 private:
     const Volume& m_volume;

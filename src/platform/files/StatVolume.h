@@ -14,7 +14,7 @@ public:
         : m_drives(drives)
         , m_uuidLinks(std::move(uuidLinks)) {}
 
-    Result<std::int32_t> serial(const QString& driveRoot) const override;
+    Result<std::int32_t> serial(const DrivePath& driveRoot) const override;
 
 private:
     const Drives& m_drives;

@@ -1,6 +1,6 @@
 #include "selection/pictures/kyoskNew.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "editing/editor/tFrmNew.h"
 #include "order/EditRecord.h"
@@ -37,7 +37,7 @@ AddressBox kyoskNew::addressBox() const {
 void kyoskNew::load() {
     // Nothing of the last picture of an order before.
     UnpackEditState(EditRecord::newPicture(), m_state.edit);
-    m_state.edit.PicturePath.clear();
+    m_state.edit.PicturePath = {};
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
     m_state.BranchChoice.clear();
     m_choice.setForm(lineFormOf(m_state.Optint));

@@ -124,8 +124,8 @@ private:
 
     void addFolder();
     void pickFolder();
-    void showFolderOf(const QString& picture);
-    void takeFolderOf(const QString& picture);
+    void showFolderOf(const DrivePath& picture);
+    void takeFolderOf(const DrivePath& picture);
     void showFolderOffer();
     void turnPage(const std::function<void()>& step);
     void showPictureCount();
@@ -134,8 +134,8 @@ private:
     void drawCells();
     void clearCells();
     void repaint(const QString& path);
-    HostPath hostOf(const QString& path) const;
-    QString pictureToDraw(const QString& path) const;
+    HostPath hostOf(const DrivePath& path) const;
+    DrivePath pictureToDraw(const QString& path) const;
     void showLarge(const QString& path);
     void showGuide(Guide guide);
     void turnLargeView();

@@ -1,5 +1,5 @@
 // The page of pictures: finding folders, turning pages, drawing small pictures and the large view.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "editing/editor/Form3.h"
 #include "editing/render/StoredSmallView.h"
 #include "imaging/files/PictureFile.h"
@@ -25,7 +25,7 @@ namespace {
 constexpr int drawnAtOnce = 2;
 } // namespace
 
-HostPath kyoskNew::hostOf(const QString& path) const {
+HostPath kyoskNew::hostOf(const DrivePath& path) const {
     return m_platform.files.drives().toHost(path).value_or(HostPath());
 }
 
@@ -76,11 +76,11 @@ void kyoskNew::pickFolder() {
     Q_EMIT changed();
     m_platform.pump.pump();
     const QString prompt = m_state.wording(u"בחר תמונה אחת בלבד ", u"Select one image only");
-    const QString picture = m_platform.dialogs.pickFile(prompt, m_state.DiskRoot, u"Open"_s);
+    const DrivePath picture = m_platform.dialogs.pickFile(prompt, m_state.DiskRoot, u"Open"_s);
     Pic4Brose.visible = false;
     Q_EMIT changed();
 
-    if (plain() && HasQuestionMark(picture)) {
+    if (plain() && HasQuestionMark(picture.text())) {
         m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
         return;
     }
@@ -94,7 +94,7 @@ void kyoskNew::pickFolder() {
     showFolderOf(picture);
 }
 
-void kyoskNew::showFolderOf(const QString& picture) {
+void kyoskNew::showFolderOf(const DrivePath& picture) {
     takeFolderOf(picture);
     if (m_choice.folders().isEmpty())
         return;
@@ -106,20 +106,20 @@ void kyoskNew::showFolderOf(const QString& picture) {
     drawPage();
 }
 
-void kyoskNew::takeFolderOf(const QString& picture) {
-    QString folder = picture.left(std::max<qsizetype>(picture.lastIndexOf(u'\\'), 0));
-    if (folder.size() <= 2)
-        folder += u'\\'; // a drive root: its path alone ends in a backslash
+void kyoskNew::takeFolderOf(const DrivePath& picture) {
+    DrivePath folder = picture.folder();
+    if (folder.text().size() <= 2)
+        folder = folder / u""; // a drive root: its path alone ends in a backslash
     File1.setFolder(folder);
     m_choice.addFolder(folder, File1.names());
-    Label29.text = folder;
+    Label29.text = folder.text();
     showPictureCount();
     if (File1.count() == 0)
         m_platform.dialogs.message(m_state
                                        .wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
                                                 u"There are no JPG pictures in the folder\n%1\nSelect a picture of "
                                                 u"another folder")
-                                       .arg(folder));
+                                       .arg(folder.text()));
 }
 
 void kyoskNew::showPictureCount() {
@@ -147,13 +147,13 @@ void kyoskNew::clearCells() {
         picture.bitmap = Bitmap();
 }
 
-QString kyoskNew::pictureToDraw(const QString& path) const {
+DrivePath kyoskNew::pictureToDraw(const QString& path) const {
     if (!plain() && m_choice.inBasket(path)) {
-        const QString stored = StoredSmallView::path(m_state, path);
+        const DrivePath stored = StoredSmallView::path(m_state, DrivePath(path));
         if (m_platform.files.fileExists(stored))
             return stored;
     }
-    return path;
+    return DrivePath(path);
 }
 
 void kyoskNew::drawCells() {
@@ -191,7 +191,7 @@ void kyoskNew::repaint(const QString& path) {
 }
 
 void kyoskNew::showLarge(const QString& path) {
-    const HostPath host = hostOf(path);
+    const HostPath host = hostOf(DrivePath(path));
     const Result<PictureSize> size = readPictureSize(host);
     if (!size)
         return;

@@ -1,5 +1,5 @@
 // The page of pictures: choosing, counting, the whole folder, and what the editor stores.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "editing/editor/tFrmNew.h"
 #include "editing/render/StoredSmallView.h"
 #include "order/EditRecord.h"
@@ -42,11 +42,11 @@ void kyoskNew::takeIntoEditor(const QString& path) {
     const std::optional<QString> record = m_choice.recordOf(path);
     // The stored view of an earlier choice would show the picture changed.
     if (!record)
-        StoredSmallView::discard(m_state, m_platform.files, path);
-    m_state.edit.PicturePath = path;
+        StoredSmallView::discard(m_state, m_platform.files, DrivePath(path));
+    m_state.edit.PicturePath = DrivePath(path);
     UnpackEditState(record.value_or(EditRecord::newPicture()), m_state.edit);
     if (m_state.edit.RedMarker == EditRecord::corrected)
-        m_state.edit.TempRedName = MangleFileName(path);
+        m_state.edit.TempRedName = MangleFileName(m_state.edit.PicturePath);
     Label24.text = m_state.edit.EditState;
 }
 
@@ -60,7 +60,7 @@ void kyoskNew::leaveEditor() {
     editor().stopHolds();
     editor().keepRecord();
     storeSmallView();
-    repaint(m_state.edit.PicturePath);
+    repaint(m_state.edit.PicturePath.text());
 }
 
 void kyoskNew::addCopies(int cell, int more) {
@@ -118,7 +118,7 @@ void kyoskNew::beginAgain() {
 }
 
 void kyoskNew::storeSmallView() {
-    if (m_state.edit.PicturePath.trimmed().isEmpty())
+    if (m_state.edit.PicturePath.text().trimmed().isEmpty())
         return;
     const Bitmap preview = editor().takeSmallView();
     if (preview.isNull())
@@ -129,7 +129,7 @@ void kyoskNew::storeSmallView() {
 }
 
 void kyoskNew::storeRecord() {
-    const QString& path = m_state.edit.PicturePath;
+    const QString& path = m_state.edit.PicturePath.text();
     const int index = path.isEmpty() ? -1 : m_choice.storeRecord(path, m_state.edit.EditState);
     if (index < 0)
         return;

@@ -33,8 +33,8 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     profile.AdUrl1 = profile.SiteUrl + u"/ad01.jpg"_s;
     profile.AdUrl2 = profile.SiteUrl + u"/ad02.jpg"_s;
     // The installation places these pictures in a folder without "2000" in front, unlike the workspace.
-    profile.AdFile1 = state.DiskRoot + u"lumora\\zmany\\ad01.jpg"_s;
-    profile.AdFile2 = state.DiskRoot + u"lumora\\zmany\\ad02.jpg"_s;
+    profile.AdFile1 = state.DiskRoot / u"lumora\\zmany\\ad01.jpg";
+    profile.AdFile2 = state.DiskRoot / u"lumora\\zmany\\ad02.jpg";
     state.profile = std::move(profile);
 
     state.MediniyutDchisa = deployment.MediniyutDchisa;

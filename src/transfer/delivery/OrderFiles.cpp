@@ -1,6 +1,6 @@
 #include "transfer/delivery/OrderFiles.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
@@ -19,9 +19,9 @@ constexpr int shortestFolder = 4;
 
 QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QStringList& entries, bool inPieces) {
     QStringList paths;
-    if (const QString log = order.logPath(); files.fileExists(log))
-        paths += log;
-    const auto append = [&](const QString& name) { paths += order.filePath(name); };
+    if (const DrivePath log = order.logPath(); files.fileExists(log))
+        paths += log.text();
+    const auto append = [&](const QString& name) { paths += order.filePath(name).text(); };
     if (inPieces) {
         const auto sheet = std::find_if(entries.begin(), entries.end(), IsSheet);
         append(sheet == entries.end() ? QString() : *sheet);
@@ -52,9 +52,9 @@ QStringList BulkFiles(const QStringList& handedOver, bool inPieces) {
     return texts + pieces;
 }
 
-QStringList HttpOrderFiles(const Files& files, const QString& folder, const QString& serverList) {
-    const QString path = folder.trimmed();
-    if (path.size() < shortestFolder)
+QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QString& serverList) {
+    const DrivePath path(folder.text().trimmed());
+    if (path.text().size() < shortestFolder)
         return {};
     QStringList paths = files.collect(path, Files::Depth::ThisFolder);
     paths.removeIf([&](const QString& each) { return LeafName(each).compare(serverList, Qt::CaseInsensitive) == 0; });

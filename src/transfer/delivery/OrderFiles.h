@@ -5,6 +5,7 @@
 
 namespace lumora {
 
+class DrivePath;
 class Files;
 class OrderFolder;
 
@@ -17,6 +18,6 @@ QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QS
 QStringList BulkFiles(const QStringList& handedOver, bool inPieces);
 
 // The files of a folder that HTTP sends: all but serverList, the file that an earlier check downloaded into the folder.
-QStringList HttpOrderFiles(const Files& files, const QString& folder, const QString& serverList);
+QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QString& serverList);
 
 } // namespace lumora

@@ -267,7 +267,7 @@ void FtpFrm::showProof() {
     if (!m_proofWanted || m_proofText.isEmpty())
         return;
     Picture13.visible = true;
-    Picture13File = WorkspacePaths::root(m_state) + QStringLiteral("\\001.jpg");
+    Picture13File = WorkspacePaths::root(m_state) / u"001.jpg";
     Q_EMIT changed();
 }
 

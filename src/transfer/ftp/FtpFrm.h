@@ -68,7 +68,7 @@ public:
     void ListRezefFiles_Click(int index);
     void takeChain(const QStringList& folderNames); // fills ListRezefFiles
     // Prepares a resend of a folder from File1, as the page of finished orders does.
-    void PrepareResendHere(const QString& folder);
+    void PrepareResendHere(const DrivePath& folder);
     // Shows the error number and the server's reply, and asks whether to close the session.
     void FtpFatalErrorAsk(const Failure& failure, const QString& source);
 

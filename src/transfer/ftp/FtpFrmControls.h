@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "transfer/delivery/SendingPage.h"
 
 #include <QStringList>
@@ -28,7 +29,7 @@ struct FtpFrmControls : SendingControls {
     Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary, shown at success
     QStringList Picture2Lines;                                         // its lines; saved as a small picture
     Caption Picture13{*this, u"Picture13", Caption::At::Hidden};       // the proof picture
-    QString Picture13File;                                             // drive path
+    DrivePath Picture13File;
 
     // Label33 and Label20 both show the seconds of the countdown; Image10 and Image11 blink in turn.
     Caption Label33{*this, u"Label33"};

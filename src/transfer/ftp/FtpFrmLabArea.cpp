@@ -1,5 +1,4 @@
 // The lab's own area of the sending page: the older bulk path and the chain of orders.
-#include "common/DrivePathText.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
@@ -61,7 +60,7 @@ void FtpFrm::sendChain() {
 
 void FtpFrm::SendChainOrder(const QString& name) {
     enter(SendingPhase::Checking);
-    const QString folder = JoinDrivePath(WorkspacePaths::orders(m_state), name);
+    const DrivePath folder = WorkspacePaths::orders(m_state) / name;
     std::optional<SendingPhase> end = SendingPhase::NoOrder;
     m_sender.pass.UserStopped = 0;
     if (m_platform.files.folderExists(folder)) {

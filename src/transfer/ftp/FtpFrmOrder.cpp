@@ -1,5 +1,5 @@
 // Lists the files that the page sends, for a new order or for a resend.
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "editing/editor/gdisave.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
@@ -53,9 +53,9 @@ void FtpFrm::listFolder() {
 }
 
 void FtpFrm::addProofPicture() {
-    const QString proof = WorkspacePaths::proofPicture(m_state);
+    const DrivePath proof = WorkspacePaths::proofPicture(m_state);
     if (m_platform.files.fileExists(proof))
-        m_sender.lists.List3.append(proof);
+        m_sender.lists.List3.append(proof.text());
 }
 
 void FtpFrm::countPictures() {

@@ -1,6 +1,5 @@
 // Events and routines of the page that no control calls: the lab's manual panel, the resend from the page's own file
 // list, and the question after a fatal error. The lab's own tests use them.
-#include "common/DrivePathText.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "order/PieceName.h"
@@ -12,7 +11,7 @@
 namespace lumora {
 
 void FtpFrm::Command27_Click() {
-    const auto made = m_platform.files.makeFolder(m_state.DiskRoot + QStringLiteral("!!AVROO"));
+    const auto made = m_platform.files.makeFolder(m_state.DiskRoot / u"!!AVROO");
     if (!made)
         m_platform.dialogs.message(made.failure().message);
     m_sender.lists.List4Tikiyot.setCurrentIndex(0);
@@ -42,7 +41,7 @@ void FtpFrm::Command3_Click() {
         m_platform.dialogs.message(QStringLiteral("Please select a local file to put"));
         return;
     }
-    m_sender.session.putHere(JoinDrivePath(File1.folder(), File1.name(File1Index)));
+    m_sender.session.putHere(File1.folder() / File1.name(File1Index));
     Q_EMIT changed();
 }
 
@@ -115,8 +114,8 @@ void FtpFrm::takeChain(const QStringList& folderNames) {
     m_sender.lists.ListRezefFiles.append(folderNames);
 }
 
-void FtpFrm::PrepareResendHere(const QString& folder) {
-    const bool pieces = TravelsInPieces(folder);
+void FtpFrm::PrepareResendHere(const DrivePath& folder) {
+    const bool pieces = TravelsInPieces(folder.text());
     File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
     if (pieces) {
         m_state.transfer.Mefurak = Travel::Pieces;
@@ -127,13 +126,13 @@ void FtpFrm::PrepareResendHere(const QString& folder) {
     File1.refresh();
     clearLists();
     TextList& list = m_sender.lists.List3;
-    const QString log = OrderFolder(folder).logPath();
+    const DrivePath log = OrderFolder(folder).logPath();
     if (m_platform.files.fileExists(log))
-        list.append(log);
+        list.append(log.text());
     for (const QString& entry : File1.names()) {
-        const QString path = JoinDrivePath(folder, entry);
+        const DrivePath path = folder / entry;
         if ((!inPieces() || IsPiece(entry) || IsSheet(entry)) && path != log)
-            list.append(path);
+            list.append(path.text());
     }
     if (list.isEmpty()) {
         m_platform.dialogs.message(wording(u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני",

@@ -1,6 +1,6 @@
 #include "transfer/ftp/FtpSession.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderFolder.h"
 #include "platform/Machine.h"
@@ -266,9 +266,10 @@ bool FtpSession::FtpSendFile(const QString& path) {
     const QString name = LeafName(path);
     pump();
     const Files& files = m_platform.files;
-    const auto local = files.drives().toHost(path);
+    const DrivePath file(path);
+    const auto local = files.drives().toHost(file);
     m_putBegun = true;
-    const auto sent = local && files.fileExists(path) ? hConnection->put(*local, name)
+    const auto sent = local && files.fileExists(file) ? hConnection->put(*local, name)
                                                       : Result<void>(Failure{Failure::Kind::NotFound, path});
     pump();
     if (sent)
@@ -441,17 +442,17 @@ void FtpSession::listHereAgain() {
     FillListFromNames(Target::List2, {});
 }
 
-void FtpSession::putHere(const QString& path) {
+void FtpSession::putHere(const DrivePath& path) {
     const auto local = m_platform.files.drives().toHost(path);
-    const auto sent = local && hConnection ? hConnection->put(*local, LeafName(path)) : Result<void>(noLine());
+    const auto sent = local && hConnection ? hConnection->put(*local, path.leaf()) : Result<void>(noLine());
     if (!sent)
         FtpFatalError(sent.failure(), QStringLiteral("FtpPutFile"));
     else
         listHereAgain();
 }
 
-void FtpSession::getHere(const QString& remoteName, const QString& localFolder) {
-    const auto local = m_platform.files.drives().toHost(JoinDrivePath(localFolder, remoteName));
+void FtpSession::getHere(const QString& remoteName, const DrivePath& localFolder) {
+    const auto local = m_platform.files.drives().toHost(localFolder / remoteName);
     const auto got = local && hConnection ? hConnection->get(remoteName, *local) : Result<void>(noLine());
     if (!got)
         FtpFatalError(got.failure(), QStringLiteral("FtpGetFile"));

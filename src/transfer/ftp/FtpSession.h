@@ -72,8 +72,8 @@ public:
     void PauseBar(int times = 1);
 
     // The manual panel, in the current remote directory. A failure closes the session.
-    void putHere(const QString& path);
-    void getHere(const QString& remoteName, const QString& localFolder);
+    void putHere(const DrivePath& path);
+    void getHere(const QString& remoteName, const DrivePath& localFolder);
     void removeHere(const QString& remoteName);
     void makeGoop();
 

@@ -1,6 +1,6 @@
 #include "transfer/ftp/UploadCheck.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "order/BrokenFiles.h"
 #include "platform/Machine.h"

@@ -1,6 +1,6 @@
 #include "transfer/ftp/UploadPass.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "order/BrokenFiles.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"

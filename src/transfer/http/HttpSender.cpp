@@ -1,7 +1,7 @@
 #include "transfer/http/HttpSender.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "order/OrderFolder.h"
 #include "order/OrderReport.h"
 #include "platform/Machine.h"
@@ -91,9 +91,9 @@ bool HttpSender::sendMissing(int) {
 }
 
 void HttpSender::post(const QString& path) {
-    const QString folder = ParentFolder(path);
+    const DrivePath folder = DrivePath(path).parent();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php");
-    lists.TxtWeb = m_script.MultipartPost(LeafName(folder), {path}, url, folder, lists.TxtUrl, {}, {});
+    lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     m_events.reached(SendingMoment::Answered);
     if (m_script.failed()) {
         m_allPosted = false;
@@ -145,14 +145,14 @@ void HttpSender::findMissing(int listNumber) {
 ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     lists.ListAfterWeb.clear();
     lists.TxtWeb.clear();
-    QString& order = m_state.transfer.OrderFolder;
-    if (order.endsWith(u'\\'))
-        order.chop(1);
+    DrivePath& order = m_state.transfer.OrderFolder;
+    if (order.text().endsWith(u'\\'))
+        order = order.folder();
     const QString name = folderName();
     m_state.transfer.ShemTikiya = name;
     m_events.reached(SendingMoment::Answered);
     if (lists.List4Kvazim.isEmpty() || !OrderFolder(order).isChosen() ||
-        LeafName(ParentFolder(lists.List4Kvazim.item(0))) != name)
+        DrivePath(lists.List4Kvazim.item(0)).parent().leaf() != name)
         return ServerVerdict::OtherFolder;
     HttpFetchFileListN(listNumber);
     if (m_stop.left)
@@ -199,13 +199,12 @@ void HttpSender::downloadList(int listNumber) {
     const Files& files = m_platform.files;
     clsDownload download(m_platform);
     // A list from an earlier check must not be read as the answer to this one.
-    const QString list = OrderFolder::chosen(m_state).filePath(ListFileName(0));
+    const DrivePath list = OrderFolder::chosen(m_state).filePath(ListFileName(0));
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)
         m_listFailure = cleared.failure();
     const QString uploads = siteAddress(QStringLiteral("/uploads/") + folderName() + u'/');
-    download.download(uploads + QStringLiteral("filelist1.txt"),
-                      JoinDrivePath(WorkspacePaths::root(m_state), QStringLiteral("filelist1.txt")));
+    download.download(uploads + QStringLiteral("filelist1.txt"), WorkspacePaths::root(m_state) / u"filelist1.txt");
     HttpPause(2);
     const QString remote = ListFileName(listNumber);
     if (cleared && !remote.isEmpty()) {

@@ -1,6 +1,6 @@
 #include "transfer/http/ServerList.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 
 #include <algorithm>
 

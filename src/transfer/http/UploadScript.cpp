@@ -1,7 +1,7 @@
 #include "transfer/http/UploadScript.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
@@ -51,20 +51,20 @@ QByteArray MultipartBody(const std::vector<UploadPart>& parts) {
     return body.append("--").append(boundary).append("--");
 }
 
-Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const QString& localFolder) {
+Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const DrivePath& localFolder) {
     auto body = readParts(files, localFolder);
     m_failure = body ? Failure{} : body.failure();
     m_fileFault = !body;
     return body;
 }
 
-Result<QByteArray> UploadScript::readParts(const QStringList& files, const QString& localFolder) const {
+Result<QByteArray> UploadScript::readParts(const QStringList& files, const DrivePath& localFolder) const {
     std::vector<UploadPart> parts;
     for (const QString& file : files) {
         const QString name = leafOf(file);
         if (breaksHeader(name))
             return Failure{Failure::Kind::Unsupported, QStringLiteral("%1: the name can't be sent").arg(name)};
-        auto bytes = m_platform.files.read(JoinDrivePath(localFolder, name));
+        auto bytes = m_platform.files.read(localFolder / name);
         if (!bytes)
             return bytes.failure();
         parts.push_back({name, std::move(*bytes)});
@@ -73,7 +73,7 @@ Result<QByteArray> UploadScript::readParts(const QStringList& files, const QStri
 }
 
 QString UploadScript::MultipartPost(const QString& folderName, const QStringList& files, const QString& url,
-                                    const QString& localFolder, const QString& extra, const QString& user,
+                                    const DrivePath& localFolder, const QString& extra, const QString& user,
                                     const QString& password) {
     auto body = bodyOf(files, localFolder);
     if (!body)
@@ -92,7 +92,7 @@ QString UploadScript::MultipartPost(const QString& folderName, const QStringList
 }
 
 QString UploadScript::MultipartPostInet(const QString& folderName, const QStringList& files, const QString& server,
-                                        const QString& url, const QString& localFolder, const QString& extra) {
+                                        const QString& url, const DrivePath& localFolder, const QString& extra) {
     auto body = bodyOf(files, localFolder);
     if (body) {
         PostRequest request;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QByteArray>
@@ -33,14 +34,14 @@ public:
     // The form that orders are sent by. Gives the answer's text, empty on failure. Of files only the leaf names count,
     // below localFolder.
     QString MultipartPost(const QString& folderName, const QStringList& files, const QString& url,
-                          const QString& localFolder, const QString& extra, const QString& user,
+                          const DrivePath& localFolder, const QString& extra, const QString& user,
                           const QString& password);
 
     // The form of the page's test button: HTTP/1.0, a comma in the content type, and an announced length of twice the
     // body's less one, filled with zeros. server is the host alone, url the path on it. Gives the answer's text, or
     // "Error: " and the reason.
     QString MultipartPostInet(const QString& folderName, const QStringList& files, const QString& server,
-                              const QString& url, const QString& localFolder, const QString& extra);
+                              const QString& url, const DrivePath& localFolder, const QString& extra);
 
     // Of the last call; the message is empty after success.
     const Failure& lastFailure() const { return m_failure; }
@@ -50,8 +51,8 @@ public:
 
 private:
     // Begins a call: resets the failure.
-    Result<QByteArray> bodyOf(const QStringList& files, const QString& localFolder);
-    Result<QByteArray> readParts(const QStringList& files, const QString& localFolder) const;
+    Result<QByteArray> bodyOf(const QStringList& files, const DrivePath& localFolder);
+    Result<QByteArray> readParts(const QStringList& files, const DrivePath& localFolder) const;
 
     const Platform& m_platform;
     Failure m_failure;

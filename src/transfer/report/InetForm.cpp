@@ -40,7 +40,7 @@ void InetForm::reportDone() {
     Q_EMIT changed();
 }
 
-bool clsDownload::download(const QString& url, const QString& path) {
+bool clsDownload::download(const QString& url, const DrivePath& path) {
     m_failure = {};
     const auto target = m_platform.files.host(path);
     if (!target) {

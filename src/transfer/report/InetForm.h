@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "session/Page.h"
 
@@ -46,7 +47,7 @@ class clsDownload {
 public:
     explicit clsDownload(const Platform& platform)
         : m_platform(platform) {}
-    bool download(const QString& url, const QString& path);
+    bool download(const QString& url, const DrivePath& path);
 
     // Of the last call; the message is empty after success.
     const Failure& lastFailure() const { return m_failure; }

@@ -1,6 +1,6 @@
 #include "views/MoogMeret/MoogMeretView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "views/kit/Gauge.h"
 #include "views/kit/ScrolledPicture.h"
 

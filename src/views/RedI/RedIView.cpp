@@ -1,6 +1,6 @@
 #include "views/RedI/RedIView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "session/SessionState.h"
 #include "views/RedI/RedEyeCanvas.h"
 #include "views/kit/Overlay.h"

@@ -1,6 +1,6 @@
 #include "views/SpltForm/SpltFormView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 
 #include <QLineEdit>
 #include <QListWidget>

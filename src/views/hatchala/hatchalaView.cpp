@@ -70,7 +70,7 @@ QLayout* hatchalaView::makeSide() {
     m_hints.push_back(makeHint(c.Label4, u"exit"_s));
     QWidget* stage = makeStage();
     m_advert = new AdvertisingPicture(theme(), this);
-    bind(u"Picture4"_s, m_advert, [this] { return c.Picture4; });
+    bind(u"Picture4"_s, m_advert, [this] { return c.Picture4.text(); });
     return inColumn(Space::Small, {{m_hints.back().box, 0, Qt::AlignTrailing},
                                    {stage, 1},
                                    {m_advert, 0, Qt::AlignCenter},

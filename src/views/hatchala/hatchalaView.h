@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "start/hatchala.h"
 #include "views/window/PageView.h"
 
@@ -45,7 +46,7 @@ private:
     Prints* m_prints = nullptr;
     ArrowStrip* m_arrow = nullptr;
     AdvertisingPicture* m_advert = nullptr;
-    QString m_advertFile;
+    DrivePath m_advertFile;
     // What the two English hints say, each with the sign of its button beside it.
     struct Hint {
         const Caption* caption;

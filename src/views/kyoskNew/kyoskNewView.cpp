@@ -1,6 +1,6 @@
 #include "views/kyoskNew/kyoskNewView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "views/kit/EditableCombo.h"
 #include "views/kit/Overlay.h"
 #include "views/kyoskNew/LargePicture.h"

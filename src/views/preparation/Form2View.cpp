@@ -1,6 +1,6 @@
 #include "views/preparation/Form2View.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 
 #include <QListWidget>
 

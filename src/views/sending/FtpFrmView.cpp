@@ -1,6 +1,6 @@
 #include "views/sending/FtpFrmView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "views/kit/Cards.h"
 #include "views/kit/Overlay.h"
 

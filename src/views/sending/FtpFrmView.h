@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "transfer/ftp/FtpFrm.h"
 #include "views/sending/SendingView.h"
 
@@ -30,7 +31,7 @@ private:
     QFrame* m_order = nullptr;
     QLabel* m_summary = nullptr;
     PictureBox* m_proof = nullptr;
-    QString m_proofFile;
+    DrivePath m_proofFile;
     QPushButton* m_sendNow = nullptr;
     QPushButton* m_count = nullptr;
     Overlay* m_leave = nullptr;

@@ -1,6 +1,6 @@
 #include "views/tFrmNew/tFrmNewView.h"
 
-#include "common/DrivePathText.h"
+#include "common/DrivePath.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "views/kit/Overlay.h"
@@ -243,14 +243,13 @@ void tFrmNewView::renderStrip() {
         QString name;
         if (m_pictures) {
             const CellPicture& cell = m_pictures->controls().Picture1[i];
-            name = cell.text;
-            look.filled = !name.isEmpty();
+            name = LeafName(cell.text);
+            look.filled = !cell.text.isEmpty();
             look.picture = cell.visible ? cell.bitmap.image() : QImage();
             look.ordered = m_pictures->controls().Picture4[i].visible;
             look.open = m_pictures->openCell() == static_cast<int>(i);
         }
         m_cells[i]->show(look);
-        name = LeafName(name);
         speak(m_cells[i], !look.filled ? c.words.emptyCell
                           : look.open  ? c.words.openCell.arg(name)
                                        : c.words.otherCell.arg(name));

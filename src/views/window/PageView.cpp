@@ -359,7 +359,7 @@ void PageView::speak(QWidget* widget, const QString& text) const {
     widget->setAccessibleName(text);
 }
 
-QImage loadedPicture(const Files& files, const QString& path) {
+QImage loadedPicture(const Files& files, const DrivePath& path) {
     const auto file = files.drives().toHost(path);
     if (!file)
         return {};

@@ -211,7 +211,7 @@ protected:
 };
 
 // The picture at a drive path, null where there is none.
-QImage loadedPicture(const Files& files, const QString& path);
+QImage loadedPicture(const Files& files, const DrivePath& path);
 
 // The control of an array: "Command4Snif(3)".
 inline QString numbered(const char* name, std::size_t index) {

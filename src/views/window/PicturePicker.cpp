@@ -118,7 +118,7 @@ bool holdsAnything(const HostPath& folder) {
 } // namespace
 
 PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                             const QString& prompt, const QString& initialFolder, const QString& title,
+                             const QString& prompt, const DrivePath& initialFolder, const QString& title,
                              Dialogs::Offer offer)
     : Overlay(theme, parent)
     , m_theme(theme)
@@ -222,7 +222,7 @@ void PicturePicker::makeGrid() {
     m_grid->setLayout(inColumn(Space::None, {m_empty}));
 }
 
-HostPath PicturePicker::firstFolder(const QString& initialFolder) const {
+HostPath PicturePicker::firstFolder(const DrivePath& initialFolder) const {
     std::error_code absent;
     if (const auto initial = m_files.drives().toHost(initialFolder);
         everyFile() && initial && std::filesystem::is_directory(*initial, absent))
@@ -232,7 +232,7 @@ HostPath PicturePicker::firstFolder(const QString& initialFolder) const {
     return (first != m_places.end() ? *first : m_places.front()).folder;
 }
 
-std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFolder) const {
+std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initialFolder) const {
     std::vector<Place> result;
     const auto add = [&](const QString& name, const QString& icon, const HostPath& folder) {
         std::error_code error;
@@ -258,7 +258,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const QString& initialFo
     add(m_state.wording(u"הורדות"_s, u"Downloads"_s), u"folder"_s, standard(QStandardPaths::DownloadLocation));
     add(m_state.wording(u"תיקיית הבית"_s, u"Home folder"_s), u"home"_s, standard(QStandardPaths::HomeLocation));
     if (const auto initial = m_files.drives().toHost(initialFolder))
-        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : initialFolder.left(2),
+        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : initialFolder.text().left(2),
             everyFile() ? u"folder"_s : u"drive"_s, *initial);
     for (const Drives::Drive& drive : drives)
         addDrive(drive);
@@ -364,7 +364,7 @@ void PicturePicker::activate(const QListWidgetItem* item) {
     if (item->data(FolderRole).toBool())
         open(path);
     else
-        Q_EMIT finished(AnsiCodePage::squeeze(m_files.drives().toDrive(path)));
+        Q_EMIT finished(AnsiCodePage::squeeze(m_files.drives().toDrive(path).text()));
 }
 
 void PicturePicker::take() {

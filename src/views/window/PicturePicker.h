@@ -23,9 +23,9 @@ struct SessionState;
 class PicturePicker : public Overlay {
     Q_OBJECT
 public:
-    // initialFolder is a drive path; the picker opens there when no better place is known.
+    // The picker opens at initialFolder when no better place is known.
     PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                  const QString& prompt, const QString& initialFolder, const QString& title, Dialogs::Offer offer);
+                  const QString& prompt, const DrivePath& initialFolder, const QString& title, Dialogs::Offer offer);
 
 Q_SIGNALS:
     // The drive path of the picture as the code page has it ("?" for what it lacks); empty for a cancel.
@@ -38,8 +38,8 @@ private:
         HostPath folder;
     };
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
-    std::vector<Place> places(const QString& initialFolder) const;
-    HostPath firstFolder(const QString& initialFolder) const;
+    std::vector<Place> places(const DrivePath& initialFolder) const;
+    HostPath firstFolder(const DrivePath& initialFolder) const;
     QLayout* makePlaces();
     void makeGrid();
     QPushButton* wordButton(const QString& name, const char* role, const QString& text,

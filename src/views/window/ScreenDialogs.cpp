@@ -82,12 +82,12 @@ bool ScreenDialogs::ask(const QString& question, const QString& title) {
     return yes;
 }
 
-QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFolder, const QString& title,
-                                Offer offer) {
+DrivePath ScreenDialogs::pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
+                                  Offer offer) {
     if (beforePick)
         beforePick();
     if (nextPick) {
-        if (const std::optional<QString> pick = nextPick())
+        if (const std::optional<DrivePath> pick = nextPick())
             return *pick;
     }
     PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, prompt, initialFolder, title, offer);
@@ -101,7 +101,7 @@ QString ScreenDialogs::pickFile(const QString& prompt, const QString& initialFol
     picker.setOpen(true);
     loop.exec();
     picker.setOpen(false);
-    return chosen;
+    return DrivePath(chosen);
 }
 
 } // namespace lumora

@@ -26,14 +26,15 @@ public:
 
     void message(const QString& text, const QString& title = {}) override;
     bool ask(const QString& question, const QString& title = {}) override;
-    QString pickFile(const QString& prompt, const QString& initialFolder, const QString& title, Offer offer) override;
+    DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
+                       Offer offer) override;
 
     // Runs before a picture is picked, so that cards put in meanwhile are found.
     std::function<void()> beforePick;
 
-    // Answers given in place of a person's; no value lets the panel come up. A pick is a drive path, empty for a
+    // Answers given in place of a person's; no value lets the panel come up. A pick is empty for a
     // cancel.
-    std::function<std::optional<QString>()> nextPick;
+    std::function<std::optional<DrivePath>()> nextPick;
     std::function<std::optional<bool>()> nextAnswer;
 
     // Every box and question so far, oldest first.

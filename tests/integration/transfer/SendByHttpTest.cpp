@@ -135,7 +135,7 @@ TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
 
 TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
     // Where the list should be stored lies a folder.
-    const QString inTheWay = UploadFormRig::folder() + u'\\' + UploadFormRig::list();
+    const DrivePath inTheWay = UploadFormRig::folder() / UploadFormRig::list();
     ASSERT_TRUE(rig.test.files.makeFolder(inTheWay));
     UploadForm& page = rig.send();
     EXPECT_EQ(page.look().sign, SendingSign::Bad);
@@ -187,8 +187,7 @@ qint64 peakMemory() {
 
 TEST_F(SendByHttp, AFileOf20MiBTakesLessThanThreeTimesItsSize) {
     constexpr qint64 size = 20 * 1024 * 1024;
-    std::filesystem::resize_file(*rig.test.drives.toHost(UploadFormRig::folder() + u'\\' + UploadFormRig::first()),
-                                 size);
+    std::filesystem::resize_file(*rig.test.drives.toHost(UploadFormRig::folder() / UploadFormRig::first()), size);
     UploadScript script(rig.test.platform);
     QFile reset(u"/proc/self/clear_refs"_s);
     ASSERT_TRUE(reset.open(QIODevice::WriteOnly));

@@ -1,0 +1,47 @@
+#include "common/DrivePath.h"
+
+#include "common/FixedText.h"
+
+#include <algorithm>
+
+namespace lumora {
+namespace {
+
+constexpr QChar backslash = u'\\';
+
+QString beforeLastBackslash(QStringView path) {
+    const qsizetype at = path.lastIndexOf(backslash);
+    return at < 0 ? notChosen : path.left(at).toString();
+}
+
+} // namespace
+
+QString DrivePath::leaf() const {
+    const qsizetype at = m_text.lastIndexOf(backslash);
+    return at < 0 ? notChosen : m_text.mid(at + 1);
+}
+
+QString DrivePath::stem() const {
+    const QString name = leaf();
+    return name.chopped(std::min<qsizetype>(4, name.size()));
+}
+
+DrivePath DrivePath::parent() const {
+    return DrivePath(beforeLastBackslash(QStringView(m_text).chopped(m_text.endsWith(backslash) ? 1 : 0)));
+}
+
+DrivePath DrivePath::folder() const {
+    return DrivePath(m_text.size() < 3 ? notChosen : beforeLastBackslash(m_text));
+}
+
+DrivePath DrivePath::operator/(QStringView name) const {
+    QString path = m_text.endsWith(backslash) ? m_text : m_text + backslash;
+    return DrivePath(path.append(name));
+}
+
+QString MangleFileName(const DrivePath& path) {
+    QString name = path.text();
+    return name.replace(backslash, u']').replace(u':', u';');
+}
+
+} // namespace lumora
