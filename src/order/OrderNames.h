@@ -1,9 +1,14 @@
 #pragma once
 
+#include <QDate>
 #include <QString>
 
 // Names of an order and of the files in its folder, as the lab's tools expect them.
 namespace lumora {
+
+// TimeOfJob, YYYY_MM_DD_SSS_ssss^: the day, the code of how the order started in exactly three characters, the mark of
+// the machine's volume.
+QString BuildTimeOfJob(const QDate& day, const QString& kodMishloach, const QString& ser);
 
 // The order name: TimeOfJob, which ends in "^", then the order number. OrderNumberOf gives the number of an order name.
 QString OrderName(const QString& TimeOfJob, const QString& number);

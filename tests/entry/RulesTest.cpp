@@ -1,7 +1,6 @@
 #include "entry/details/DetailStore.h"
 #include "entry/details/DetailsCheck.h"
 #include "entry/details/TileMenu.h"
-#include "entry/details/TimeOfJob.h"
 #include "entry/details/VolumeMark.h"
 
 #include "common/FixedText.h"
@@ -34,12 +33,6 @@ TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
         }
         EXPECT_EQ(shown, c.tiles) << c.letter.toStdString() << c.tmunatPaar << c.minuyPaar;
     }
-}
-
-TEST(TimeOfJobTest, HasDayCodeAndVolumeInFixedPlaces) {
-    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), u"KUP"_s, u"1234"_s), u"2026_11_21_KUP_1234^");
-    EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), u"P"_s, QString()), u"0987_01_02_P  _^");
-    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), u"LONG"_s, u"7"_s), u"2026_01_02_LON_7^");
 }
 
 TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {

@@ -1,6 +1,7 @@
 #include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
+#include "order/OrderNames.h"
 #include "order/OrderReport.h"
 #include "session/TextList.h"
 #include "support/ExampleOrder.h"
@@ -23,6 +24,12 @@ SessionState orderOfDana() {
 const QString reportOfDana =
     u"?k1=tarvelmond&t1=2026_11_21_KUP_1234^105    10_15G_FIT_NB&t2=Notes: gift - &t3=Pratim: 03-1234567    Dana "
     "Levi&t4=Adress: &t5=Mail: dana@example.com&t8=Total_pics: 13"_s;
+
+TEST(TimeOfJob, HasDayCodeAndVolumeInFixedPlaces) {
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), u"KUP"_s, u"1234"_s), u"2026_11_21_KUP_1234^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), u"P"_s, QString()), u"0987_01_02_P  _^");
+    EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), u"LONG"_s, u"7"_s), u"2026_01_02_LON_7^");
+}
 
 TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
     SessionState state = orderOfDana();
