@@ -1,6 +1,6 @@
 #include "selection/FinishRule.h"
 
-#include "common/FixedText.h"
+#include "common/PaperSize.h"
 
 namespace lumora {
 
@@ -17,8 +17,8 @@ CouponFit checkCoupon(int couponPictures, int total) {
 }
 
 DeepCompression deepCompression(const QString& ppr, int policy) {
-    const QString longer = RightPart(ppr, 2).trimmed();
-    if ((longer.isEmpty() ? 15 : Val16(longer)) < 45)
+    const std::optional<PaperSize> paper = PaperSize::ofText(ppr);
+    if (!paper || paper->longSide < 45)
         return DeepCompression::Off;
     return policy == 1 ? DeepCompression::Ask : policy == 2 ? DeepCompression::On : DeepCompression::Off;
 }

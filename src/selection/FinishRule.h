@@ -15,7 +15,7 @@ CouponFit checkCoupon(int couponPictures, int total);
 
 // Deep compression of large prints, whose longer side is 45 or more.
 enum class DeepCompression { Off, On, Ask };
-// policy: 1 ask, 2 always; any other never. A paper without a size counts as 15.
+// policy: 1 ask, 2 always; any other never, as for a paper without a size.
 DeepCompression deepCompression(const QString& ppr, int policy);
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #include "views/nnn/nnnView.h"
 
+#include "common/PaperSize.h"
 #include "entry/details/TileMenu.h"
 #include "views/kit/Cards.h"
 #include "views/kit/Overlay.h"
@@ -97,7 +98,8 @@ QWidget* nnnView::makeOptions() {
     auto* sizes = inRow(Space::Wide);
     for (std::size_t i = 0; i < c.Option1.size(); ++i) {
         const auto paper = [](QPainter& painter, const QRectF& place, const QString& size) {
-            drawPaperSample(painter, place, size);
+            const PaperSize sides = PaperSize::ofText(withoutIsolation(size)).value_or(PaperSize());
+            drawPaperSample(painter, place, QSizeF(sides.shortSide, sides.longSide));
         };
         auto* card = new DrawingCard(theme(), this, paper, {190, 200}, DrawingCard::Words::Size);
         bindChoice(card, c.Option1[i], [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
