@@ -118,7 +118,7 @@ Result<void> Workspace::MakeOrderFolder() const {
     return m_files.makeFolder(WorkspacePaths::orders(m_state));
 }
 
-Result<void> Workspace::CleanWorkspace() const {
+Result<void> Workspace::CleanWorkspace(QString& MisparHazmana) const {
     const DrivePath orders = WorkspacePaths::orders(m_state);
     const struct {
         DrivePath folder;
@@ -136,11 +136,11 @@ Result<void> Workspace::CleanWorkspace() const {
 
     const DrivePath counter = WorkspacePaths::counter(m_state);
     if (!m_files.fileExists(counter)) {
-        m_state.MisparHazmana = QStringLiteral("100");
+        MisparHazmana = QStringLiteral("100");
     } else if (const Result<QByteArray> bytes = m_files.read(counter)) {
         // A counter without a line, like one that can't be read, leaves the number as it was.
         if (const std::optional<QString> line = firstLine(*bytes))
-            m_state.MisparHazmana = QString::number(counterValue(*line));
+            MisparHazmana = QString::number(counterValue(*line));
     }
 
     (void)m_files.removeFile(orders / u"111.jpg");

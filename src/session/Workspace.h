@@ -29,7 +29,7 @@ DrivePath proofPicture(const SessionState& state);   // 000.jpg
 // The folder tree on the program's own drive and its clean-up before each order.
 class Workspace {
 public:
-    Workspace(SessionState& state, const Files& files)
+    Workspace(const SessionState& state, const Files& files)
         : m_state(state)
         , m_files(files) {}
 
@@ -41,9 +41,9 @@ public:
     Result<void> MakeCounterFolder() const;
     Result<void> MakeOrderFolder() const;
 
-    // Empties the scratch folders, writes mana.txt afresh, reads the order number. Files that may not or cannot be
-    // deleted are passed over.
-    Result<void> CleanWorkspace() const;
+    // Empties the scratch folders, writes mana.txt afresh and reads the order number into MisparHazmana. Files that may
+    // not or cannot be deleted are passed over.
+    Result<void> CleanWorkspace(QString& MisparHazmana) const;
 
     // Removes the print files of the orders already made, but for the file at index 0 of each folder.
     void CleanHistory() const;
@@ -54,7 +54,7 @@ public:
 private:
     void deleteMatching(const DrivePath& folder, const QString& ending) const;
 
-    SessionState& m_state;
+    const SessionState& m_state;
     const Files& m_files;
 };
 

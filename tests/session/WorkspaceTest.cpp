@@ -34,7 +34,7 @@ TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
     EXPECT_EQ(machine.files.folders(u"C:\\"_path), QStringList({"2000lumora", "vedron"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::root(state)), QStringList({"!!000", "misgarot", "zmany"}));
     EXPECT_EQ(machine.files.folders(WorkspacePaths::zmany(state)), QStringList({"job_folder", "ktanim", "tempred"}));
-    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"100");
     EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\!!000\\mana.txt"_path), "1\r\n");
 }
@@ -45,15 +45,15 @@ TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
     ASSERT_FALSE(made.ok());
     EXPECT_TRUE(made.failure().message.contains(u"2000lumora")) << made.failure().message.toStdString();
     EXPECT_FALSE(workspace.MakeRootFolders());
-    EXPECT_FALSE(workspace.CleanWorkspace().ok()) << "mana.txt has no folder to lie in";
+    EXPECT_FALSE(workspace.CleanWorkspace(state.MisparHazmana).ok()) << "mana.txt has no folder to lie in";
 }
 
 TEST_F(WorkspaceTest, WritesTheNextNumberAndReadsItAtTheNextOrder) {
     make();
-    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     ASSERT_TRUE(workspace.writeCounter().ok());
     EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "101\r\n");
-    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"101");
 }
 
@@ -70,7 +70,7 @@ TEST_F(WorkspaceTest, TakesWhatItCanOfADamagedCounter) {
     for (const auto& c : cases) {
         state.MisparHazmana = u"55"_s;
         put(WorkspacePaths::counter(state), c.stored);
-        ASSERT_TRUE(workspace.CleanWorkspace().ok());
+        ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
         EXPECT_EQ(state.MisparHazmana, c.number) << c.stored.toStdString();
     }
 }
@@ -91,7 +91,7 @@ TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
                               "C:\\2000lumora\\!!000\\kept.jpp",         "C:\\2000lumora\\000.jpg"};
     for (const QString& path : gone + kept)
         put(DrivePath(path));
-    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     for (const QString& path : gone)
         EXPECT_FALSE(machine.files.fileExists(DrivePath(path))) << path.toStdString();
     for (const QString& path : kept)
@@ -106,7 +106,7 @@ TEST_F(WorkspaceTest, PassesOverAFileThatItCannotDelete) {
     const HostPath odd = *folder / "\xE6\xBC\xA2.jpg";
     std::ofstream(odd) << "x";
     put(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_path);
-    ASSERT_TRUE(workspace.CleanWorkspace().ok());
+    ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_TRUE(std::filesystem::exists(odd));
     EXPECT_FALSE(machine.files.fileExists(u"C:\\2000lumora\\zmany\\ktanim\\z.jpg"_path));
 }

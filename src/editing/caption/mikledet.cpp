@@ -35,6 +35,7 @@ Bitmap palette() {
 mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(pageId)
     , m_state(state)
+    , m_edit(state.edit)
     , m_platform(platform)
     , m_chain(chain)
     , m_timer1(moveMilliseconds, [this] { moveOnce(); })
@@ -46,7 +47,7 @@ mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& cha
 }
 
 void mikledet::load() {
-    EditFields& edit = m_state.edit;
+    EditFields& edit = m_edit;
     Picture18Image = palette();
     letters = m_state.english() ? KeyLayout::Letters::Small : KeyLayout::Letters::Hebrew;
     if (edit.TextOn == 0) {
@@ -74,7 +75,7 @@ void mikledet::refresh() {
     Command9.checked = letters == KeyLayout::Letters::Small;
     Command2.checked = letters == KeyLayout::Letters::Capital;
     for (int alignment = 0; alignment < 3; ++alignment)
-        Image5[static_cast<std::size_t>(alignment)].checked = m_state.edit.TextAlign == alignment;
+        Image5[static_cast<std::size_t>(alignment)].checked = m_edit.TextAlign == alignment;
     Q_EMIT changed();
 }
 
@@ -140,7 +141,7 @@ void mikledet::clear() {
 
 void mikledet::putOnPicture(bool on) {
     Check4.checked = on;
-    m_state.edit.TextOn = on ? 1 : 0;
+    m_edit.TextOn = on ? 1 : 0;
     commitText();
 }
 
@@ -149,7 +150,7 @@ void mikledet::chooseFont(int index) {
         return;
     Combo1List.setCurrentIndex(index);
     Combo1.text = Combo1List.currentItem();
-    m_state.edit.TextFont = Combo1.text;
+    m_edit.TextFont = Combo1.text;
     commitText();
 }
 
@@ -189,50 +190,50 @@ void mikledet::holdMove(std::int16_t x, std::int16_t y) {
 void mikledet::moveOnce() {
     if (!m_held.ticks(m_timer1))
         return;
-    CaptionStep::move(m_state.edit, MoveStepX, MoveStepY);
+    CaptionStep::move(m_edit, MoveStepX, MoveStepY);
     commitText();
 }
 
 void mikledet::resizeOnce() {
     if (!m_held.ticks(m_timer2))
         return;
-    CaptionStep::resize(m_state.edit, SizeStep);
+    CaptionStep::resize(m_edit, SizeStep);
     commitText();
 }
 
 void mikledet::change(void (*step)(EditFields& edit)) {
-    step(m_state.edit);
+    step(m_edit);
     commitText();
 }
 
 void mikledet::align(int alignment) {
     if (alignment < 0 || alignment > EditRecord::alignFar)
         return;
-    m_state.edit.TextAlign = static_cast<std::int16_t>(alignment);
+    m_edit.TextAlign = static_cast<std::int16_t>(alignment);
     commitText();
 }
 
 void mikledet::takeColour(QPoint at) {
     if (!Picture18Image.image().rect().contains(at))
         return;
-    CaptionStep::colour(m_state.edit, Picture18Image.image().pixel(at));
+    CaptionStep::colour(m_edit, Picture18Image.image().pixel(at));
     commitText();
 }
 
 int mikledet::style() const {
-    return m_state.edit.TextStyle & 3;
+    return m_edit.TextStyle & 3;
 }
 
 bool mikledet::runsDown() const {
-    return m_state.edit.TextVertical == EditRecord::runsDown;
+    return m_edit.TextVertical == EditRecord::runsDown;
 }
 
 QRgb mikledet::colour() const {
-    return qRgb(m_state.edit.TextRed, m_state.edit.TextGreen, m_state.edit.TextBlue);
+    return qRgb(m_edit.TextRed, m_edit.TextGreen, m_edit.TextBlue);
 }
 
 void mikledet::textChanged() {
-    m_state.edit.TextBody = Text1.text;
+    m_edit.TextBody = Text1.text;
     commitText();
 }
 

@@ -105,7 +105,8 @@ private:
     void resizeOnce();
     void backToEditor();
 
-    SessionState& m_state;
+    const SessionState& m_state;
+    EditFields& m_edit;
     const Platform& m_platform;
     PageChain& m_chain;
     Ticker m_timer1;

@@ -65,7 +65,7 @@ int statusOf(Failure::Kind kind) {
 
 } // namespace
 
-gdisave::gdisave(SessionState& state, const Platform& platform, PageChain& chain, Starter start)
+gdisave::gdisave(const SessionState& state, const Platform& platform, PageChain& chain, Starter start)
     : Page(pageId)
     , m_state(state)
     , m_platform(platform)

@@ -37,7 +37,7 @@ public:
     // Starts the drawing library and tells its status, 0 for success.
     using Starter = std::function<int()>;
 
-    gdisave(SessionState& state, const Platform& platform, PageChain& chain, Starter start = {});
+    gdisave(const SessionState& state, const Platform& platform, PageChain& chain, Starter start = {});
 
     void load() override;
     void setTexts() override;
@@ -79,7 +79,7 @@ public:
 private:
     void showFailure(const Failure& failure);
 
-    SessionState& m_state;
+    const SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     Starter m_start;

@@ -22,6 +22,7 @@ namespace lumora {
 tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::tFrmNew)
     , m_state(state)
+    , m_edit(state.edit)
     , m_platform(platform)
     , m_chain(chain)
     , m_frames(platform.files, WorkspacePaths::misgarot(state))
@@ -53,17 +54,13 @@ void tFrmNew::load() {
         static_cast<void>(m_platform.files.makeFolder(WorkspacePaths::misgarot(m_state)));
     Combo4List.append(m_frames.categories());
     if (!Combo4List.isEmpty()) {
-        edit().FrameFolder = Combo4List.item(0);
+        m_edit.FrameFolder = Combo4List.item(0);
         Combo4.text = Combo4List.item(0);
         Combo4List.setCurrentIndex(0);
     }
     fillFrames(FrameLists::ListFile::Png);
     PackEditState();
     showNumbers();
-}
-
-EditFields& tFrmNew::edit() const {
-    return m_state.edit;
 }
 
 BigPics& tFrmNew::surfaces() const {
@@ -108,36 +105,36 @@ void tFrmNew::OpenPictureInEditor() {
 
     ResetEditorZoom();
     m_open = loadPictureOfRecord();
-    Title.text = m_open ? edit().PicturePath.leaf() : QString();
+    Title.text = m_open ? m_edit.PicturePath.leaf() : QString();
     Picture3.visible = m_open;
     Image19.visible = !m_open;
     PlaceTextLabel();
     showNumbers();
     if (!m_open)
         return;
-    if (edit().AutoMarker == EditRecord::levelled)
+    if (m_edit.AutoMarker == EditRecord::levelled)
         surfaces().measureLevels();
-    if (edit().ToneFlag == 1)
+    if (m_edit.ToneFlag == 1)
         surfaces().turnGrey();
-    workPicture()->placeAtCentreIfUnset(edit());
-    putHandle(QPointF(edit().PanX, edit().PanY));
+    workPicture()->placeAtCentreIfUnset(m_edit);
+    putHandle(QPointF(m_edit.PanX, m_edit.PanY));
     packRenderStore();
 }
 
 void tFrmNew::ResetEditorZoom() {
-    PreviewZoom = edit().ZoomPercent;
+    PreviewZoom = m_edit.ZoomPercent;
 }
 
 bool tFrmNew::loadPictureOfRecord() {
-    if (edit().RedMarker != EditRecord::corrected)
-        return LoadWorkBitmap(edit().PicturePath);
-    edit().TempRedName = MangleFileName(edit().PicturePath);
-    const DrivePath copy = WorkspacePaths::corrected(m_state, edit().PicturePath);
+    if (m_edit.RedMarker != EditRecord::corrected)
+        return LoadWorkBitmap(m_edit.PicturePath);
+    m_edit.TempRedName = MangleFileName(m_edit.PicturePath);
+    const DrivePath copy = WorkspacePaths::corrected(m_state, m_edit.PicturePath);
     if (m_platform.files.fileExists(copy))
         return LoadWorkBitmap(copy);
     // The picture is then shown and printed without the correction.
-    edit().RedMarker = EditRecord::notMarked;
-    if (!LoadWorkBitmap(edit().PicturePath))
+    m_edit.RedMarker = EditRecord::notMarked;
+    if (!LoadWorkBitmap(m_edit.PicturePath))
         return false;
     tell(QStringLiteral("תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"),
          QStringLiteral("The red-eye correction of this picture was lost. It is shown and printed without it"),
@@ -185,8 +182,8 @@ void tFrmNew::pickAnotherPicture() {
     backToPictures();
     // The record of the picture that is left keeps its zoom and gains.
     m_open = false;
-    edit().ZoomPercent = 100;
-    edit().GainR = edit().GainG = edit().GainB = 1;
+    m_edit.ZoomPercent = 100;
+    m_edit.GainR = m_edit.GainG = m_edit.GainB = 1;
     ResetEditorZoom();
     Q_EMIT picked(picture);
 }
@@ -208,16 +205,16 @@ void tFrmNew::putHandle(QPointF position) {
 }
 
 void tFrmNew::handleToFields() {
-    edit().PanX = HoldIn16Bits(Image3.position().x());
-    edit().PanY = HoldIn16Bits(Image3.position().y());
+    m_edit.PanX = HoldIn16Bits(Image3.position().x());
+    m_edit.PanY = HoldIn16Bits(Image3.position().y());
 }
 
 void tFrmNew::PackEditState() {
     // The handle has no place before a picture is open.
     if (m_open)
         handleToFields();
-    lumora::PackEditState(edit(), LeftField(m_state.shemot.Bord, 2), Combo4.text);
-    Label13.text = edit().EditState;
+    lumora::PackEditState(m_edit, LeftField(m_state.shemot.Bord, 2), Combo4.text);
+    Label13.text = m_edit.EditState;
 }
 
 void tFrmNew::StoreCurrentEdit() {
@@ -232,11 +229,11 @@ Bitmap tFrmNew::takeSmallView() {
     if (!m_open || !m_drawnSinceTaken)
         return {};
     m_drawnSinceTaken = false;
-    return workPicture()->render(edit(), frame(edit()));
+    return workPicture()->render(m_edit, frame(m_edit));
 }
 
 void tFrmNew::RenderPreview() {
-    PicPic = drawn(edit());
+    PicPic = drawn(m_edit);
     m_drawnSinceTaken = true;
     Q_EMIT changed();
 }
@@ -271,7 +268,7 @@ void tFrmNew::undoAllEdits() {
         PreviewZoom = zoomBefore;
         return;
     }
-    ColourStep::undo(edit());
+    ColourStep::undo(m_edit);
     // The reload may have changed the paper, so the centre is that of the new one.
     putHandle(QPointF(PicPicSize.width / 2, PicPicSize.height / 2));
     handleToFields();
@@ -282,13 +279,13 @@ void tFrmNew::undoAllEdits() {
 // --- looking ---
 
 void tFrmNew::showNumbers() {
-    Label10.text = QString::number(edit().RotationCode);
+    Label10.text = QString::number(m_edit.RotationCode);
     Label11.text = QString::number(PreviewZoom);
 }
 
 // RotationCode is 180 for an upright picture.
 int tFrmNew::turnDegrees() const {
-    const int angle = (m_state.edit.RotationCode - 180 + 720) % 360;
+    const int angle = (m_edit.RotationCode - 180 + 720) % 360;
     return angle > 180 ? angle - 360 : angle;
 }
 
@@ -311,7 +308,7 @@ void tFrmNew::measureLevels() {
     if (!m_open)
         return;
     surfaces().measureLevels();
-    edit().AutoMarker = EditRecord::levelled;
+    m_edit.AutoMarker = EditRecord::levelled;
     packRenderStore();
 }
 

@@ -236,7 +236,6 @@ private:
     void PlaceTextLabel();
 
     // Opening, packing, drawing, storing.
-    EditFields& edit() const;
     BigPics& surfaces() const;
     EditedPreview* workPicture() const;
     HostPath hostOf(const DrivePath& path) const;
@@ -256,7 +255,8 @@ private:
     void renderPackStore();
     void showNumbers();
 
-    SessionState& m_state;
+    const SessionState& m_state;
+    EditFields& m_edit;
     const Platform& m_platform;
     PageChain& m_chain;
     FrameLists m_frames;

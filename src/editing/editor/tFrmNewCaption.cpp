@@ -12,11 +12,11 @@ void tFrmNew::writeCaption() {
     if (!m_open)
         return;
     stopHolds();
-    if (edit().TextOn == 0) {
-        CaptionStep::begin(edit());
+    if (m_edit.TextOn == 0) {
+        CaptionStep::begin(m_edit);
         PlaceTextLabel();
     }
-    m_chain.load<mikledet>().open(edit().TextBody, edit().TextOn == 1);
+    m_chain.load<mikledet>().open(m_edit.TextBody, m_edit.TextOn == 1);
     m_chain.follow(pageId, Outcome::CaptionWanted);
     Q_EMIT changed();
 }
@@ -30,9 +30,9 @@ void tFrmNew::takeCaption() {
 }
 
 void tFrmNew::PlaceTextLabel() {
-    Labeltext.visible = m_open && edit().TextOn == 1;
-    Labeltext.text = TextLabelPlace::blanks(edit());
-    LabeltextBox = TextLabelPlace::boxOf(edit());
+    Labeltext.visible = m_open && m_edit.TextOn == 1;
+    Labeltext.text = TextLabelPlace::blanks(m_edit);
+    LabeltextBox = TextLabelPlace::boxOf(m_edit);
 }
 
 void tFrmNew::beginCaptionDrag(QPointF at) {
@@ -49,7 +49,7 @@ void tFrmNew::dragCaption(QPointF at) {
     LabeltextBox.left = m_labelHandle.position().x();
     LabeltextBox.top = m_labelHandle.position().y();
     // Only a copy of the fields follows the finger; the record waits until it is lifted.
-    EditFields meanwhile = edit();
+    EditFields meanwhile = m_edit;
     const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, meanwhile);
     meanwhile.TextX = static_cast<std::int16_t>(anchor.x());
     meanwhile.TextY = static_cast<std::int16_t>(anchor.y());
@@ -62,9 +62,9 @@ void tFrmNew::endCaptionDrag() {
     if (!m_labelHandle.held())
         return;
     m_labelHandle.release();
-    const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, edit());
-    edit().TextX = static_cast<std::int16_t>(anchor.x());
-    edit().TextY = static_cast<std::int16_t>(anchor.y());
+    const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, m_edit);
+    m_edit.TextX = static_cast<std::int16_t>(anchor.x());
+    m_edit.TextY = static_cast<std::int16_t>(anchor.y());
     RenderPreview();
     StoreCurrentEdit();
 }

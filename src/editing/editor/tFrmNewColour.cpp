@@ -11,7 +11,7 @@ namespace lumora {
 void tFrmNew::brighten() {
     if (!m_held.ticks(Timer3))
         return;
-    ColourStep::brighten(edit(), m_step);
+    ColourStep::brighten(m_edit, m_step);
     RenderPreview();
     PackEditState();
 }
@@ -36,7 +36,7 @@ void tFrmNew::useTool(int index) {
 void tFrmNew::changeColours(void (*step)(EditFields& edit)) {
     if (!m_open)
         return;
-    step(edit());
+    step(m_edit);
     renderPackStore();
 }
 
@@ -44,16 +44,16 @@ void tFrmNew::correctRedEyes() {
     if (!m_open)
         return;
     stopHolds();
-    m_chain.load<RedI>().open(edit().PicturePath);
+    m_chain.load<RedI>().open(m_edit.PicturePath);
 }
 
 void tFrmNew::takeTone(Tone tone) {
     if (!m_open)
         return;
     // A second grey step would darken the picture again.
-    if (edit().ToneFlag != 1)
+    if (m_edit.ToneFlag != 1)
         surfaces().turnGrey();
-    ColourStep::takeTone(edit(), tone);
+    ColourStep::takeTone(m_edit, tone);
     PackEditState();
     StoreCurrentEdit();
     RenderPreview();
@@ -68,10 +68,10 @@ void tFrmNew::backToColour() {
         return;
     stopHolds();
     ResetEditorZoom();
-    if (!LoadWorkBitmap(edit().PicturePath))
+    if (!LoadWorkBitmap(m_edit.PicturePath))
         return;
-    ColourStep::backToColour(edit());
-    putHandle(QPointF(edit().PanX, edit().PanY));
+    ColourStep::backToColour(m_edit);
+    putHandle(QPointF(m_edit.PanX, m_edit.PanY));
     renderPackStore();
     hidePanels();
 }

@@ -50,8 +50,8 @@ void tFrmNew::chooseFrame(int index) {
 }
 
 void tFrmNew::takeFrame() {
-    edit().FrameFolder = Combo4.text;
-    edit().FrameName = Combo2.text;
+    m_edit.FrameFolder = Combo4.text;
+    m_edit.FrameName = Combo2.text;
 }
 
 void tFrmNew::nextFrame() {
@@ -71,7 +71,7 @@ void tFrmNew::useFrame() {
     if (!m_open)
         return;
     takeFrame();
-    if (edit().FrameName == EditRecord::noFrame && !Combo2List.isEmpty())
+    if (m_edit.FrameName == EditRecord::noFrame && !Combo2List.isEmpty())
         chooseFrame(0);
     Misgerett.checked = true;
     packRenderStore();
@@ -80,8 +80,8 @@ void tFrmNew::useFrame() {
 void tFrmNew::removeFrame() {
     if (!m_open)
         return;
-    edit().LineFrameCode = m_lineFrame.removedCode();
-    edit().FrameName = EditRecord::frameRemoved;
+    m_edit.LineFrameCode = m_lineFrame.removedCode();
+    m_edit.FrameName = EditRecord::frameRemoved;
     packRenderStore();
 }
 
@@ -103,7 +103,7 @@ const std::optional<Bitmap>& tFrmNew::frame(const EditFields& fields) {
 }
 
 int tFrmNew::frameOnPicture() const {
-    const EditFields& fields = m_state.edit;
+    const EditFields& fields = m_edit;
     const bool ofCategory = m_open && fields.FrameFolder.trimmed() == Combo4.text;
     return ofCategory ? Combo2List.find(fields.FrameName.trimmed()) : -1;
 }
@@ -131,7 +131,7 @@ void tFrmNew::stepLineStyle(int places) {
         return;
     Combo5List.setCurrentIndex(m_lineFrame.style());
     Combo5.text = Combo5List.currentItem();
-    edit().LineFrameCode = m_lineFrame.code();
+    m_edit.LineFrameCode = m_lineFrame.code();
     packRenderStore();
 }
 

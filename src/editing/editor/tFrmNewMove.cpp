@@ -68,7 +68,7 @@ void tFrmNew::zoom() {
     if (!m_held.ticks(Timer2))
         return;
     PreviewZoom = EditStep::zoom(PreviewZoom, m_step);
-    edit().ZoomPercent = PreviewZoom;
+    m_edit.ZoomPercent = PreviewZoom;
     RenderPreview();
     showNumbers();
 }
@@ -79,7 +79,7 @@ void tFrmNew::zoomReleased(Release release) {
         m_platform.pump.pump();
     if (!m_open || opening != m_openings)
         return; // another picture was opened meanwhile
-    edit().ZoomPercent = PreviewZoom;
+    m_edit.ZoomPercent = PreviewZoom;
     PackEditState();
     StoreCurrentEdit();
 }
@@ -87,7 +87,7 @@ void tFrmNew::zoomReleased(Release release) {
 void tFrmNew::turn() {
     if (!m_held.ticks(Timer6))
         return;
-    edit().RotationCode = EditStep::turn(edit().RotationCode, m_step);
+    m_edit.RotationCode = EditStep::turn(m_edit.RotationCode, m_step);
     showNumbers();
     renderPackStore();
 }
@@ -113,17 +113,17 @@ void tFrmNew::panBy(QPointF distance) {
 void tFrmNew::turnTo(std::int16_t code) {
     if (!m_open)
         return;
-    edit().RotationCode = code;
+    m_edit.RotationCode = code;
     showNumbers();
     packRenderStore();
 }
 
 void tFrmNew::turnQuarterRight() {
-    turnTo(EditStep::quarterRight(edit().RotationCode));
+    turnTo(EditStep::quarterRight(m_edit.RotationCode));
 }
 
 void tFrmNew::turnQuarterLeft() {
-    turnTo(EditStep::quarterLeft(edit().RotationCode));
+    turnTo(EditStep::quarterLeft(m_edit.RotationCode));
 }
 
 // --- dragging the picture ---
@@ -143,7 +143,7 @@ void tFrmNew::drag(QPointF at) {
     Image3.move(at);
     putHandle(Image3.position());
     // Only a copy of the fields follows the finger; the record waits until it is lifted.
-    EditFields meanwhile = edit();
+    EditFields meanwhile = m_edit;
     meanwhile.PanX = HoldIn16Bits(Image3.position().x());
     meanwhile.PanY = HoldIn16Bits(Image3.position().y());
     PicPic = drawn(meanwhile);

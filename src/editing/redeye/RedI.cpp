@@ -35,6 +35,7 @@ QPoint pixelAt(QPointF at) {
 RedI::RedI(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(pageId)
     , m_state(state)
+    , m_edit(state.edit)
     , m_platform(platform)
     , m_chain(chain)
     , Timer1(holdPace, [this] { resizeOnce(); })
@@ -247,7 +248,7 @@ void RedI::accept() {
             showState();
             return;
         }
-        m_state.edit.RedMarker = EditRecord::corrected;
+        m_edit.RedMarker = EditRecord::corrected;
         m_chain.load<tFrmNew>().keepRecord();
     }
     close();

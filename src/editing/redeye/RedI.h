@@ -13,6 +13,7 @@
 
 namespace lumora {
 
+struct EditFields;
 struct Platform;
 struct SessionState;
 class PageChain;
@@ -176,7 +177,8 @@ private:
     void showLevel();
     void showState();
 
-    SessionState& m_state;
+    const SessionState& m_state;
+    EditFields& m_edit;
     const Platform& m_platform;
     PageChain& m_chain;
     RedEyeSight m_sight;

@@ -367,7 +367,7 @@ bool nnn::prepareOrder() {
     if (done)
         done = workspace.MakeOrderFolder();
     if (done)
-        done = workspace.CleanWorkspace();
+        done = workspace.CleanWorkspace(m_state.MisparHazmana);
     return succeeded(done);
 }
 

@@ -7,7 +7,7 @@
 
 namespace lumora {
 
-Havharot::Havharot(SessionState& state, const Platform& platform, PageChain& chain)
+Havharot::Havharot(const SessionState& state, const Platform& platform, PageChain& chain)
     : Page(pageId)
     , m_state(state)
     , m_platform(platform)

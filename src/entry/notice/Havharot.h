@@ -25,7 +25,7 @@ class Havharot : public Page, private HavharotControls {
 public:
     static constexpr PageId pageId = PageId::Havharot;
 
-    Havharot(SessionState& state, const Platform& platform, PageChain& chain);
+    Havharot(const SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;
     // A plain page with just a way back, for a tile behind which this lab has put nothing. With the details page gone
@@ -49,7 +49,7 @@ private:
     void openMailProgram();
     void tellHowToSetUpMail();
 
-    SessionState& m_state;
+    const SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     bool m_plain = false;

@@ -14,7 +14,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-SpltForm::SpltForm(SessionState& state, const Platform& platform, PageChain& chain)
+SpltForm::SpltForm(const SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::SpltForm)
     , m_state(state)
     , m_platform(platform)

@@ -56,7 +56,7 @@ struct SpltFormControls : Controls {
 class SpltForm : public Page, private SpltFormControls {
     Q_OBJECT
 public:
-    SpltForm(SessionState& state, const Platform& platform, PageChain& chain);
+    SpltForm(const SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;
 
@@ -134,7 +134,7 @@ private:
     QString notJoined(const DrivePath& path, const Failure& failure) const;
     QString reason(const Failure& failure) const;
 
-    SessionState& m_state;
+    const SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     Mod4split m_pieces;

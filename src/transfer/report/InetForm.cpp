@@ -11,7 +11,7 @@
 
 namespace lumora {
 
-InetForm::InetForm(SessionState& state, const Platform& platform, PageChain& chain)
+InetForm::InetForm(const SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::InetForm)
     , m_state(state)
     , m_platform(platform) {

@@ -18,7 +18,7 @@ class InetForm : public Page {
 public:
     static constexpr PageId pageId = PageId::InetForm;
 
-    InetForm(SessionState& state, const Platform& platform, PageChain& chain);
+    InetForm(const SessionState& state, const Platform& platform, PageChain& chain);
 
     // Events.
     void Command1_Click() { reportOrder(); }
