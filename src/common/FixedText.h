@@ -6,7 +6,7 @@
 
 namespace lumora {
 
-// The text of a field that was not chosen yet, and of a part that a path does not have.
+// The text of a field that was not chosen yet, and of a part that a path lacks.
 inline const QString notChosen = QStringLiteral("***");
 
 // Left-justified in a field of width characters, blank-filled, cut when too long.

@@ -11,7 +11,7 @@
 // Files of this machine, read and written whole. A failure's message names the path, or what the caller calls it.
 namespace lumora {
 
-// What errno says: "PATH: reason", and where what is told too, "PATH: what: reason".
+// The failure of an errno: "PATH: reason", or "PATH: what: reason".
 Failure systemFailure(int error, const QString& path);
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int error);
 
@@ -32,13 +32,13 @@ private:
     int m_number;
 };
 
-// For reading only, and only what is a plain file: a pipe would wait for ever.
+// Opens a plain file for reading only. Anything else is a failure, since opening a pipe would wait for ever.
 Result<Descriptor> openSource(const std::filesystem::path& host, const QString& path);
 
 // The next bytes of an open file, up to the capacity given; 0 at the end.
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
 
-// The next bytes that are read are those behind the first offset ones.
+// The next read begins behind the first offset bytes.
 Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path);
 
 // The whole file; one larger than that many bytes is a failure. path is for the message.
@@ -78,7 +78,7 @@ int removeLeftovers(const std::filesystem::path& folder, std::filesystem::file_t
 // has failed, which its commit tells.
 Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& target, const QString& path);
 
-// All of it at once.
+// Writes a whole file as NewContent does.
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes);
 
 } // namespace lumora

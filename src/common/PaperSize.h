@@ -6,7 +6,7 @@
 
 namespace lumora {
 
-// What the order's paper says when it has prints of several sizes.
+// The paper of an order with prints of several sizes.
 inline const QString mixedSizes = QStringLiteral("zz/zz");
 
 // The two ends of a paper text: its first two characters, what stands between, its last two. "10/15" gives the size
@@ -22,7 +22,7 @@ struct PaperSize {
     // From a paper as the order names it, "10/15": its first two characters and its last two. No value for a text
     // without two usable numbers, as "zz/zz".
     static std::optional<PaperSize> ofText(const QString& paper);
-    // From a size code, "1015". No value for a text of another length too.
+    // From a size code, "1015". No value for a text of another length either.
     static std::optional<PaperSize> ofDigits(const QString& code);
 };
 

@@ -9,8 +9,8 @@
 
 namespace lumora {
 
-// What went wrong, in a form that can be shown to a person: the message says what happened, to which file or
-// server, and why. The kind is for the code that decides what follows.
+// What went wrong. The message is shown to a person and says what happened, to which file or server, and why; the kind
+// is for the code that decides what follows.
 struct Failure {
     enum class Kind {
         NotFound,

@@ -16,14 +16,14 @@ struct CaptionText {
     const char16_t* englishHint = hebrewHint;
 };
 
-// The same for a text that is no caption's: what is spoken of a control.
+// A text of the table that belongs to no caption: what is spoken of a control.
 struct WordingText {
     QString& text;
     const char16_t* hebrew;
     const char16_t* english = hebrew;
 };
 
-// Every caption of the table says its text and its hint in the language of the session.
+// Sets each caption of the table to its text and its hint in the language of the session.
 inline void setCaptions(const SessionState& state, std::initializer_list<CaptionText> texts) {
     for (const CaptionText& text : texts) {
         text.caption.text = state.wording(text.hebrew, text.english);

@@ -39,14 +39,14 @@ public:
         : m_id(id) {}
 
     PageId id() const { return m_id; }
-    // What the page shows, for views, scenarios and tests: to be read only. None here.
+    // What views, scenarios and tests read of the page; a page without controls has none.
     virtual const Controls& controls() const;
     virtual void load() {}
-    // Runs the place where all the page's texts are set, in the language of the session.
+    // Sets all the page's texts in the language of the session.
     virtual void setTexts() {}
 
 Q_SIGNALS:
-    // Cheap: a view renders once however often this is sent meanwhile.
+    // A view renders once, however often this is sent meanwhile.
     void changed();
 
 private:

@@ -53,7 +53,7 @@ public:
     Page* front() const { return m_shown.empty() ? nullptr : m_shown.back(); }
     bool isRegistered(PageId id) const { return m_makers.contains(id); }
 
-    // The end of the program: nothing is saved. Whoever runs the process ends it on ended().
+    // Ends the program without saving anything: the process ends on ended().
     void endProgram();
     bool hasEnded() const { return m_ended; }
 

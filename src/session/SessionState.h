@@ -150,7 +150,6 @@ struct EditFields {
     QString TextBody;
 };
 
-// What the senders share.
 // The kind of an order, under the numbers that the order log, the print files and their names carry.
 enum class OrderKind : std::int16_t {
     NotChosen = 0,
@@ -175,6 +174,7 @@ enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
 // In which form the files of an order travel.
 enum class Travel : std::int16_t { Whole = 0, Pieces = 1 };
 
+// What the senders share.
 struct TransferState {
     DrivePath OrderFolder;     // of the order that is being prepared, sent or looked at
     DrivePath OrderLogBase;    // path of the order log without ".txt"

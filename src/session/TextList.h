@@ -7,9 +7,9 @@ namespace lumora {
 
 class Controls;
 
-// A page's list of texts with a current index, the carrier of every working collection. The index rules are those that
-// the paging relies on: clearing gives -1, removing the current item gives -1, removing below it lowers it by one,
-// inserting at or below it raises it by one, and appending never moves it. An item out of range reads as an empty text.
+// A list of texts with a current index. Paging relies on these rules of the index: clearing gives -1, removing the
+// current item gives -1, removing below it lowers it by one, inserting at or below it raises it by one, and appending
+// never moves it. An item out of range reads as an empty text.
 class TextList {
 public:
     TextList() = default;

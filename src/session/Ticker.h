@@ -13,7 +13,7 @@ public:
 
     void start();
     void stop() { m_timer.stop(); }
-    void tick() { m_tick(); } // now, and the running time goes on
+    void tick() { m_tick(); } // leaves the running time as it is
     bool running() const { return m_timer.isActive(); }
     int interval() const { return m_timer.interval(); }
     void setInterval(int milliseconds) { m_timer.setInterval(milliseconds); }
