@@ -33,6 +33,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // In the order in which each stands on those before it.
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line)
@@ -113,9 +115,8 @@ Result<void> Program::start() {
     std::error_code error;
     const bool made = std::filesystem::create_directories(dataFolder, error);
     if (error) {
-        return Failure{Failure::Kind::AccessDenied,
-                       QStringLiteral("%1: the data folder can't be made: %2")
-                           .arg(toText(dataFolder), QString::fromStdString(error.message()))};
+        return Failure{Failure::Kind::AccessDenied, u"%1: the data folder can't be made: %2"_s.arg(
+                                                        toText(dataFolder), QString::fromStdString(error.message()))};
     }
     // A folder that stood there already may serve others too, and keeps its rights; what is made in it is closed.
     if (made)

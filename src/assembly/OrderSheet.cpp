@@ -14,6 +14,9 @@
 #include <array>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 struct SizeStep {
@@ -77,9 +80,8 @@ QString deliveryLine(const std::array<DeliveryPlace, 3>& places, const QString& 
 }
 
 QString topLine(const SessionState& state, const QDateTime& now, const QString& delivery) {
-    return QStringLiteral("No.....") + state.MisparHazmana + u'_' + state.shemot.ser + QStringLiteral("    ") +
-           now.toString(QStringLiteral("dd/MM/yyyy HH:mm:ss")) + QStringLiteral("     ") + delivery +
-           QStringLiteral(" ver: ") + state.shemot.Girsa;
+    return u"No....."_s + state.MisparHazmana + u'_' + state.shemot.ser + u"    "_s +
+           now.toString(u"dd/MM/yyyy HH:mm:ss"_s) + u"     "_s + delivery + u" ver: "_s + state.shemot.Girsa;
 }
 
 QString plainTopLine(const SessionState& state, const QDateTime& now) {
@@ -87,17 +89,16 @@ QString plainTopLine(const SessionState& state, const QDateTime& now) {
 }
 
 QString customerLine(const OrderDetails& shemot) {
-    return QStringLiteral("  Name....") + shemot.n1 + QStringLiteral("        Tel.....") + shemot.n2 +
-           QStringLiteral("      ") + shemot.n4;
+    return u"  Name...."_s + shemot.n1 + u"        Tel....."_s + shemot.n2 + u"      "_s + shemot.n4;
 }
 
 QString addressLine(const OrderDetails& shemot) {
-    return QStringLiteral("    ") + shemot.n3 + QStringLiteral("      ");
+    return u"    "_s + shemot.n3 + u"      "_s;
 }
 
 QString totalLine(const OrderDetails& shemot, const QString& beforeMail) {
-    return QStringLiteral("  Total pictures...") + QString::number(shemot.TotalPics) + QStringLiteral("   Border=  ") +
-           shemot.Bord + beforeMail + QStringLiteral("Mail  ") + shemot.Mail;
+    return u"  Total pictures..."_s + QString::number(shemot.TotalPics) + u"   Border=  "_s + shemot.Bord + beforeMail +
+           u"Mail  "_s + shemot.Mail;
 }
 
 } // namespace
@@ -118,16 +119,12 @@ QColor orderSheetBackground(SheetKind kind, const SessionState& state) {
 
 QStringList plainSheetLines(const SessionState& state, const QDateTime& now) {
     const OrderDetails& shemot = state.shemot;
-    const QString paper = shemot.ppr == mixedSizes
-                              ? shemot.ppr + QStringLiteral("   paper  Kind") + shemot.Soog2 + u' ' + shemot.Soog1
-                              : QStringLiteral("  Paper size....") + shemot.ppr + QStringLiteral("       paper  Kind") +
-                                    shemot.maat + QStringLiteral("    ") + shemot.FillFit;
-    return {plainTopLine(state, now),
-            customerLine(shemot),
-            addressLine(shemot),
-            paper,
-            totalLine(shemot, QStringLiteral("   ")),
-            shemot.Hearot};
+    const QString paper =
+        shemot.ppr == mixedSizes
+            ? shemot.ppr + u"   paper  Kind"_s + shemot.Soog2 + u' ' + shemot.Soog1
+            : u"  Paper size...."_s + shemot.ppr + u"       paper  Kind"_s + shemot.maat + u"    "_s + shemot.FillFit;
+    return {plainTopLine(state, now),    customerLine(shemot), addressLine(shemot), paper,
+            totalLine(shemot, u"   "_s), shemot.Hearot};
 }
 
 QStringList editedSheetLines(const SessionState& state, const QDateTime& now) {
@@ -135,9 +132,9 @@ QStringList editedSheetLines(const SessionState& state, const QDateTime& now) {
     return {topLine(state, now, deliveryLine(editedPlaces, state.KodMishloach) + u' '),
             customerLine(shemot),
             addressLine(shemot),
-            QStringLiteral("  Paper size....") + shemot.ppr + QStringLiteral("       paper Kind  ") + shemot.maat,
-            totalLine(shemot, QStringLiteral("     ")),
-            QStringLiteral("  ") + shemot.Hearot};
+            u"  Paper size...."_s + shemot.ppr + u"       paper Kind  "_s + shemot.maat,
+            totalLine(shemot, u"     "_s),
+            u"  "_s + shemot.Hearot};
 }
 
 QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
@@ -147,26 +144,24 @@ QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
     const auto& extras = album.Tosafot2;
     return {
         plainTopLine(state, now),
-        QStringLiteral("  ShemZalam....") + album.ShemZalam + QStringLiteral("        TelZalam.....") + album.TelZalam +
-            QStringLiteral("      ") + state.shemot.n4,
+        u"  ShemZalam...."_s + album.ShemZalam + u"        TelZalam....."_s + album.TelZalam + u"      "_s +
+            state.shemot.n4,
         // No line break behind the event: the address goes on beside it.
-        QStringLiteral("  ShemErooa....") + album.ShemErooa + QStringLiteral("    ") + state.shemot.n3 +
-            QStringLiteral("      "),
-        QStringLiteral("  MailZalam....") + album.MailZalam,
-        QStringLiteral("  Total pictures...") + QString::number(state.shemot.TotalPics),
+        u"  ShemErooa...."_s + album.ShemErooa + u"    "_s + state.shemot.n3 + u"      "_s,
+        u"  MailZalam...."_s + album.MailZalam,
+        u"  Total pictures..."_s + QString::number(state.shemot.TotalPics),
         rule,
-        QStringLiteral("  GodelLBM....") + album.GodelLBM + QStringLiteral("       SoogLBM....") + album.SoogLBM +
-            QStringLiteral("     SoogNiar....") + album.SoogNiar,
-        QStringLiteral("  SoogKricha....") + album.SoogKricha,
+        u"  GodelLBM...."_s + album.GodelLBM + u"       SoogLBM...."_s + album.SoogLBM + u"     SoogNiar...."_s +
+            album.SoogNiar,
+        u"  SoogKricha...."_s + album.SoogKricha,
         rule,
-        u' ' + extras[0] + gap + extras[1] + gap + extras[2] + gap + extras[3] + QStringLiteral("  "),
-        u' ' + extras[4] + gap + extras[5] + gap + extras[6] + gap + extras[7] + gap + extras[8] +
-            QStringLiteral("     "),
+        u' ' + extras[0] + gap + extras[1] + gap + extras[2] + gap + extras[3] + u"  "_s,
+        u' ' + extras[4] + gap + extras[5] + gap + extras[6] + gap + extras[7] + gap + extras[8] + u"     "_s,
         rule,
-        u' ' + album.KamutHorim + QStringLiteral("  אלבום הורים  "),
-        QStringLiteral("   סוג  אלבום  הורים  ") + album.SoogHorim + QStringLiteral("   "),
+        u' ' + album.KamutHorim + u"  אלבום הורים  "_s,
+        u"   סוג  אלבום  הורים  "_s + album.SoogHorim + u"   "_s,
         rule,
-        QStringLiteral("  Hearot....") + state.shemot.Hearot,
+        u"  Hearot...."_s + state.shemot.Hearot,
         rule,
     };
 }

@@ -7,6 +7,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
     const double ratio = static_cast<double>(source.height) / std::max(source.width, 1);
     const int width = (ratio >= 1 ? paper.shortSide : paper.longSide) * pixelsPerCentimetre;
@@ -25,8 +27,7 @@ Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize 
     const PictureSize target = paperPictureSize(*size, paper);
     if (target.width < 1 || target.height < 1)
         return Failure{Failure::Kind::Damaged,
-                       QStringLiteral("%1: nothing is left of a picture of %2 x %3 on this paper")
-                           .arg(toText(source))
+                       u"%1: nothing is left of a picture of %2 x %3 on this paper"_s.arg(toText(source))
                            .arg(size->width)
                            .arg(size->height)};
     return scalePictureToJpeg(source, target, printQuality);

@@ -13,6 +13,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain)
     : Page(id)
     , m_state(state)
@@ -33,7 +35,7 @@ bool PreparationPage::somethingChosen() {
     if (!controls().List1.isEmpty())
         return true;
     setStage(Stage::Waiting);
-    tell(QStringLiteral("לא נבחרו תמונות"), QStringLiteral("No pictures were chosen"));
+    tell(u"לא נבחרו תמונות"_s, u"No pictures were chosen"_s);
     return false;
 }
 
@@ -66,14 +68,14 @@ std::optional<OrderFolder> PreparationPage::claimFolder(OrderFolder::Ending endi
     const Files& files = m_platform.files;
     const OrderFolder same = OrderFolder::inPreparation(m_state, ending);
     if (m_claimed && m_claimed->path() == same.path()) {
-        for (const QString& name : files.names(same.path(), QStringLiteral("*.jpp")))
+        for (const QString& name : files.names(same.path(), u"*.jpp"_s))
             static_cast<void>(files.removeFile(same.filePath(name)));
         return same;
     }
     const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
     if (!claimed) {
-        tell(QStringLiteral("לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."),
-             QStringLiteral("The order's folder can't be made. Free some space or mend the rights, then try again."),
+        tell(u"לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."_s,
+             u"The order's folder can't be made. Free some space or mend the rights, then try again."_s,
              claimed.failure().message);
         return std::nullopt;
     }
@@ -91,8 +93,8 @@ bool PreparationPage::forEachPicture(const std::function<void(int)>& step) {
             return false;
     }
     if (m_writeFailures > 1)
-        tell(QStringLiteral("%1 קבצים של ההזמנה לא נכתבו.").arg(m_writeFailures),
-             QStringLiteral("%1 files of the order could not be written.").arg(m_writeFailures));
+        tell(u"%1 קבצים של ההזמנה לא נכתבו."_s.arg(m_writeFailures),
+             u"%1 files of the order could not be written."_s.arg(m_writeFailures));
     return true;
 }
 
@@ -109,16 +111,14 @@ bool PreparationPage::pack(PrintPacker& packer, const PrintPacker::Line& line,
 // On a full disk every picture fails in the same way: the first is told at once, the others in one sum at the end.
 void PreparationPage::tellWriteFailure(const Failure& failure) {
     if (m_writeFailures++ == 0)
-        tell(QStringLiteral("קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."),
-             QStringLiteral("A file of the order could not be written. What was prepared so far is kept."),
-             failure.message);
+        tell(u"קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."_s,
+             u"A file of the order could not be written. What was prepared so far is kept."_s, failure.message);
 }
 
 void PreparationPage::countOrder() {
     if (const Result<void> counted = Workspace(m_state, m_platform.files).writeCounter(); !counted)
-        tell(QStringLiteral("מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."),
-             QStringLiteral("The number of the next order could not be stored. This order goes on."),
-             counted.failure().message);
+        tell(u"מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."_s,
+             u"The number of the next order could not be stored. This order goes on."_s, counted.failure().message);
 }
 
 bool PreparationPage::writeLog(const OrderFolder& folder, OrderLog::Layout layout) {
@@ -126,10 +126,9 @@ bool PreparationPage::writeLog(const OrderFolder& folder, OrderLog::Layout layou
         OrderLog::of(m_state, layout, controls().List1.items(), controls().List4fail.items(), m_platform.clock.now())
             .write();
     if (const Result<void> logged = m_platform.files.writeWhole(folder.logPath(), log); !logged) {
-        tell(QStringLiteral("לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."),
-             QStringLiteral(
-                 "The order's details can't be written, so the order was not sent. What was prepared is kept. "
-                 "Put it right, then try again."),
+        tell(u"לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
+             u"The order's details can't be written, so the order was not sent. What was prepared is kept. "
+             u"Put it right, then try again."_s,
              logged.failure().message);
         return false;
     }
@@ -142,8 +141,8 @@ void PreparationPage::handOver(Outcome prepared) {
     m_state.transfer.SugMishloah = Sending::NewOrder;
     const bool goesOn = m_chain.canFollow(id(), prepared);
     if (!goesOn)
-        tell(QStringLiteral("ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."),
-             QStringLiteral("The order is ready, but this version has no page to go on with it."),
+        tell(u"ההזמנה מוכנה, אך הדף הבא אינו קיים בגרסה זו."_s,
+             u"The order is ready, but this version has no page to go on with it."_s,
              m_state.transfer.OrderFolder.text());
     if (!goesOn || prepared == Outcome::KeptAtStation)
         m_state.handOver.notice =

@@ -9,6 +9,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 PrintPacker::PrintPacker(const SessionState& state, const Files& files, OrderFolder folder, int tailForm)
     : m_state(state)
     , m_files(files)
@@ -35,8 +37,8 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
         return {false, written.failure()};
 
     const QString base = PrintBaseName(line.path);
-    m_manifestLine = QString::number(made->size()) + QStringLiteral(">>") + line.code +
-                     QString::number(m_runningNumber) + u'_' + base + QStringLiteral(".jpg\r\n");
+    m_manifestLine = QString::number(made->size()) + u">>"_s + line.code + QString::number(m_runningNumber) + u'_' +
+                     base + u".jpg\r\n"_s;
     if (!m_folderThere)
         return {false, m_folderThere.failure()};
     const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));

@@ -8,6 +8,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 QString LeftField(const QString& text, int width) {
     return text.leftJustified(width, u' ', true);
 }
@@ -72,7 +74,7 @@ QString ZeroPadded(long long number, int width) {
 
 QString PlainNumber(float number) {
     if (number == 0.0F || !std::isfinite(number))
-        return QStringLiteral("0");
+        return u"0"_s;
     const int magnitude = static_cast<int>(std::floor(std::log10(std::fabs(static_cast<double>(number)))));
     QString text = QString::number(static_cast<double>(number), 'f', std::clamp(6 - magnitude, 0, 60));
     if (text.contains(u'.')) {
@@ -107,7 +109,7 @@ QString HexToDecimal(const QString& hex) {
     const bool hexadecimal = std::all_of(digits.begin(), digits.end(),
                                          [](QChar c) { return (c >= u'0' && c <= u'9') || (c >= u'A' && c <= u'F'); });
     if (!hexadecimal || digits.isEmpty() || digits.size() > 8)
-        return QStringLiteral("00");
+        return u"00"_s;
     const auto number = digits.toULongLong(nullptr, 16);
     if (number <= 0xFFFF && digits.size() <= 4)
         return QString::number(static_cast<std::int16_t>(number));

@@ -14,6 +14,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr std::string_view temporaryPrefix = ".lumora-";
@@ -45,11 +47,11 @@ QString nameOf(const std::filesystem::path& path) {
 } // namespace
 
 Failure systemFailure(int error, const QString& path) {
-    return {kindOf(error), QStringLiteral("%1: %2").arg(path, QString::fromLocal8Bit(std::strerror(error)))};
+    return {kindOf(error), u"%1: %2"_s.arg(path, QString::fromLocal8Bit(std::strerror(error)))};
 }
 
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int error) {
-    return systemFailure(error, QStringLiteral("%1: %2").arg(nameOf(path), what));
+    return systemFailure(error, u"%1: %2"_s.arg(nameOf(path), what));
 }
 
 Descriptor::Descriptor(Descriptor&& other) noexcept
@@ -73,7 +75,7 @@ Result<Descriptor> openSource(const std::filesystem::path& host, const QString& 
     if (!source.valid() || ::fstat(source.number(), &status) != 0)
         return systemFailure(errno, path);
     if (!S_ISREG(status.st_mode))
-        return Failure{Failure::Kind::Unsupported, QStringLiteral("%1: not a file").arg(path)};
+        return Failure{Failure::Kind::Unsupported, u"%1: not a file"_s.arg(path)};
     return source;
 }
 
@@ -200,7 +202,7 @@ Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& ta
 }
 
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes) {
-    NewContent content(path, QStringLiteral("%1: can't be written").arg(nameOf(path)));
+    NewContent content(path, u"%1: can't be written"_s.arg(nameOf(path)));
     content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
     return content.commit();
 }

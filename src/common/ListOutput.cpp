@@ -6,11 +6,14 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 const QDate zeroDay(1899, 12, 30);
-const QString dayAndTime = QStringLiteral("yyyy-MM-dd hh:mm:ss");
-const QString dayAlone = QStringLiteral("yyyy-MM-dd");
+const QString dayAndTime = u"yyyy-MM-dd hh:mm:ss"_s;
+const QString dayAlone = u"yyyy-MM-dd"_s;
 
 } // namespace
 
@@ -41,7 +44,7 @@ ListOutput& ListOutput::date(const std::optional<QDateTime>& value) {
     if (midnight)
         form = dayAlone;
     else if (zeroDate)
-        form = QStringLiteral("hh:mm:ss");
+        form = u"hh:mm:ss"_s;
     m_bytes.append('#').append(when.toString(form).toLatin1()).append('#');
     return *this;
 }
@@ -70,7 +73,7 @@ public:
     void append(const QString& part, bool endsInCrLf) {
         if (m_open)
             m_text += m_break;
-        m_break = endsInCrLf ? QStringLiteral("\r\n") : QStringLiteral("\n");
+        m_break = endsInCrLf ? u"\r\n"_s : u"\n"_s;
         const qsizetype from = m_text.size();
         m_text += part;
         if (m_valueAt < 0 && m_text.startsWith(u'"')) {

@@ -8,6 +8,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The largest number that a counter is believed: it must fit, with one added, wherever an order number goes.
@@ -136,7 +138,7 @@ Result<void> Workspace::CleanWorkspace(QString& MisparHazmana) const {
 
     const DrivePath counter = WorkspacePaths::counter(m_state);
     if (!m_files.fileExists(counter)) {
-        MisparHazmana = QStringLiteral("100");
+        MisparHazmana = u"100"_s;
     } else if (const Result<QByteArray> bytes = m_files.read(counter)) {
         // A counter without a line, like one that can't be read, leaves the number as it was.
         if (const std::optional<QString> line = firstLine(*bytes))
@@ -151,7 +153,7 @@ void Workspace::CleanHistory() const {
     const DrivePath orders = WorkspacePaths::orders(m_state);
     for (const QString& order : m_files.folders(orders)) {
         const DrivePath folder = orders / order;
-        const QStringList names = m_files.names(folder, QStringLiteral("*.*"));
+        const QStringList names = m_files.names(folder, u"*.*"_s);
         // The first file of a folder is its order sheet, which stays as the record of the order.
         for (qsizetype i = 1; i < names.size(); ++i) {
             if (names[i].endsWith(u"jpp"))
@@ -169,7 +171,7 @@ Result<void> Workspace::writeCounter() const {
 
 // The pattern knows no letter case, the test of the ending does: "a.Jpg" stays, and so does what can't be deleted.
 void Workspace::deleteMatching(const DrivePath& folder, const QString& ending) const {
-    for (const QString& name : m_files.names(folder, QStringLiteral("*.") + ending)) {
+    for (const QString& name : m_files.names(folder, u"*."_s + ending)) {
         if (name.endsWith(ending) || name.endsWith(ending.toUpper()))
             (void)m_files.removeFile(folder / name);
     }

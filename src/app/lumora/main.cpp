@@ -10,6 +10,7 @@
 #include <cstdio>
 
 using namespace lumora;
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -30,24 +31,18 @@ int main(int argc, char** argv) {
     Application application(argc, argv);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
     QCommandLineParser parser;
-    parser.setApplicationDescription(QStringLiteral("Orders prints from a photo lab."));
-    const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")},
-                                  QStringLiteral("Show this help and end."));
-    const QCommandLineOption version({QStringLiteral("v"), QStringLiteral("version")},
-                                     QStringLiteral("Show the version and end."));
-    const QCommandLineOption lab(QStringLiteral("lab"), QStringLiteral("Read the lab's settings from FILE."),
-                                 QStringLiteral("FILE"));
-    const QCommandLineOption window(QStringLiteral("window"),
-                                    QStringLiteral("Run in a window, not over the whole screen."));
-    const QCommandLineOption area(QStringLiteral("operator"),
-                                  QStringLiteral("Open the hidden area of the sending page, for the lab's people."));
+    parser.setApplicationDescription(u"Orders prints from a photo lab."_s);
+    const QCommandLineOption help({u"h"_s, u"help"_s}, u"Show this help and end."_s);
+    const QCommandLineOption version({u"v"_s, u"version"_s}, u"Show the version and end."_s);
+    const QCommandLineOption lab(u"lab"_s, u"Read the lab's settings from FILE."_s, u"FILE"_s);
+    const QCommandLineOption window(u"window"_s, u"Run in a window, not over the whole screen."_s);
+    const QCommandLineOption area(u"operator"_s, u"Open the hidden area of the sending page, for the lab's people."_s);
     parser.addOptions({help, version, lab, window, area});
     if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
-        std::fprintf(
-            stderr, "lumora: %s\n",
-            qPrintable(parser.errorText().isEmpty()
-                           ? QStringLiteral("unexpected argument '%1'").arg(parser.positionalArguments().first())
-                           : parser.errorText()));
+        std::fprintf(stderr, "lumora: %s\n",
+                     qPrintable(parser.errorText().isEmpty()
+                                    ? u"unexpected argument '%1'"_s.arg(parser.positionalArguments().first())
+                                    : parser.errorText()));
         return notStarted;
     }
     if (parser.isSet(help)) {

@@ -20,6 +20,9 @@
 #include <vector>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int shownForAWhile = 2000; // milliseconds
@@ -161,8 +164,7 @@ Result<void> B3::keepToneCopy(const BasketLine& line, NewContent& copy) {
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
 void B3::saveThumbnail(const BasketLine& line, const DrivePath& scratch) {
     const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
-    const DrivePath path =
-        m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + QStringLiteral(".bmp"));
+    const DrivePath path = m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + u".bmp"_s);
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
     const Result<PictureSize> size =
         source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch.text()};
@@ -186,7 +188,7 @@ bool B3::buildOrderSheet() {
                      orderSheetBackground(SheetKind::Edited, m_state));
     sheet.drawLines(editedSheetLines(m_state, m_platform.clock.now()));
     std::vector<SheetCell> cells;
-    FileList File1(m_platform.files, QStringLiteral("*.bmp"));
+    FileList File1(m_platform.files, u"*.bmp"_s);
     File1.setFolder(m_jobFolder);
     for (const QString& name : File1.names()) {
         // Twice the last four characters: of the ending and of the name itself.

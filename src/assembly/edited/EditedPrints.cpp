@@ -12,6 +12,9 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -29,7 +32,7 @@ EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::pa
         return {Failure{Failure::Kind::Other, toText(toneCopy)}, std::move(copy)};
     return {renderEditedPrintToJpeg(print, edit), std::move(copy)};
 } catch (const std::bad_alloc&) {
-    return {Failure{Failure::Kind::TooLarge, QStringLiteral("%1: memory is short").arg(toText(print.file))}};
+    return {Failure{Failure::Kind::TooLarge, u"%1: memory is short"_s.arg(toText(print.file))}};
 }
 
 } // namespace

@@ -18,6 +18,9 @@
 #include <vector>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 BasketLine split(const QString& line) {
@@ -27,7 +30,7 @@ BasketLine split(const QString& line) {
 // Either spelling of the camera and no other: what else there is was picked with a whole folder.
 bool isJpegItem(const QString& item) {
     const QString ending = item.right(3);
-    return ending == QLatin1String("JPG") || ending == QLatin1String("jpg");
+    return ending == u"JPG" || ending == u"jpg";
 }
 
 } // namespace
@@ -186,8 +189,7 @@ bool Form2::prepareOrder() {
     if (!drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain))
         return false;
 
-    const DrivePath sheetPath =
-        folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, QStringLiteral(".jpp")));
+    const DrivePath sheetPath = folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, u".jpp"_s));
     const Result<QByteArray> sheet = encodeJpeg(Picture5Image, printQuality);
     const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
     if (!saved)
@@ -255,8 +257,8 @@ void Form2::showProgress() {
     PreparationPage::showProgress();
     Label4removed.visible = !List4removed.isEmpty();
     Label4removed.text = m_state
-                             .wording(QStringLiteral("%1 קבצים שאינם תמונות jpg הוסרו מהרשימה:"),
-                                      QStringLiteral("Files that are no jpg pictures and were left out: %1"))
+                             .wording(u"%1 קבצים שאינם תמונות jpg הוסרו מהרשימה:"_s,
+                                      u"Files that are no jpg pictures and were left out: %1"_s)
                              .arg(List4removed.count());
 }
 

@@ -7,6 +7,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 Havharot::Havharot(const SessionState& state, const Platform& platform, PageChain& chain)
     : Page(pageId)
     , m_state(state)
@@ -58,7 +60,7 @@ void Havharot::endProgram() {
 }
 
 void Havharot::openMailProgram() {
-    m_platform.shell.openWebPage(QStringLiteral("mailto:"));
+    m_platform.shell.openWebPage(u"mailto:"_s);
 }
 
 void Havharot::tellHowToSetUpMail() {
