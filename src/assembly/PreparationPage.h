@@ -1,17 +1,11 @@
 #pragma once
 
-#include "assembly/PrintPacker.h"
-#include "common/Result.h"
+#include "assembly/Preparation.h"
 #include "imaging/Bitmap.h"
-#include "order/OrderFolder.h"
-#include "order/OrderLog.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/PageFlow.h"
 #include "session/TextList.h"
-
-#include <functional>
-#include <optional>
 
 namespace lumora {
 
@@ -33,9 +27,9 @@ struct PreparationControls : Controls {
     Bitmap Picture5Image;
 };
 
-// What the two pages share that turn a basket into an order folder (Form2, B3): the list with its progress, the loop
-// over the pictures, what is written behind it, the hand-over to a sender, and the words for all that can go wrong.
-class PreparationPage : public Page {
+// What the two pages share that turn a basket into an order folder (Form2, B3): the list with its progress, the words
+// for all that can go wrong, and the hand-over to a sender.
+class PreparationPage : public Page, protected PreparationEvents {
     Q_OBJECT
 public:
     // State
@@ -55,11 +49,10 @@ protected:
 
     virtual PreparationControls& shared() = 0;
 
-    enum class Stage { Waiting, Checking, Sheet, Pictures, Closing, Done };
+    using Stage = PreparationStage;
 
     // Takes the lines of the hand-over; answers whether the page before asks for the start.
     bool takeLines();
-    void countTotal();
     // False, with words, when there is nothing to prepare.
     bool somethingChosen();
     // The two lines of the warning not to delete the pictures yet.
@@ -71,33 +64,28 @@ protected:
     void setStage(Stage stage, int position = 0);
     // All sentences about progress, in the language of the session.
     virtual void showProgress();
-    void addFailed(const DrivePath& path);
 
-    // Claims a number that is free by making its folder, which the senders are told too. A second start of this page
-    // keeps number and folder, less the print files of the first. No value, with words, when the folder can't be made.
-    std::optional<OrderFolder> claimFolder(OrderFolder::Ending ending);
-    // step() for each line of List1, the page painted behind each. False when a click ended the program.
-    bool forEachPicture(const std::function<void(int)>& step);
-    // Adds what could not be packed to List4fail and says why, once for a whole order.
-    bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
-    void tellWriteFailure(const Failure& failure);
-    void countOrder();
-    // False, with words: without its log an order does not leave.
-    bool writeLog(const OrderFolder& folder, OrderLog::Layout layout);
+    // --- what the preparation tells ---
+    void reached(Stage stage, int position) override;
+    void counted() override;
+    void inWork(const DrivePath& picture) override;
+    void notPrepared(const DrivePath& picture) override;
+    void notWritten(NotWritten what, const Failure& failure) override;
+    void filesNotWritten(int count) override;
+    void sheetDrawn(const Bitmap& sheet) override;
+    bool yield() override;
 
-    // The order is whole: the page flow has the page that goes on with it, and this one is left.
-    void handOver(Outcome prepared);
+    // The order is whole: the page flow has the page that goes on with it, and this one is left. A local station keeps
+    // its orders.
+    void handOver(Outcome toSender);
     bool handedOver() const { return m_handedOver; }
     void leaveProgram();
 
     void tell(const QString& hebrew, const QString& english, const QString& reason = {});
-    // Lets the page paint and a click through. False when that click ended the program.
-    bool yield();
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
-    int m_writeFailures = 0;
 
 private:
     Stage m_stage = Stage::Waiting;
@@ -105,7 +93,6 @@ private:
     int m_count = 0;
     bool m_preparing = false;
     bool m_handedOver = false;
-    std::optional<OrderFolder> m_claimed;
 };
 
 } // namespace lumora

@@ -4,6 +4,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 QString PreparationPage::doNotDelete() const {
     return m_state.wording(u"אם בכוונתך למחוק את התמונות מהמחשב או מהמצלמה או מכל מדיה אחרת",
                            u"If you mean to delete the pictures from the computer, the camera or any other "
@@ -22,6 +24,30 @@ QString PreparationPage::countText() const {
 QString PreparationPage::totalText() const {
     const QString& copies = controls().Label5.text;
     return copies.isEmpty() ? QString() : m_state.wording(u"תמונות להדפסה: %1", u"Prints: %1").arg(copies);
+}
+
+void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
+    switch (what) {
+    case NotWritten::Folder:
+        return tell(u"לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."_s,
+                    u"The order's folder can't be made. Free some space or mend the rights, then try again."_s,
+                    failure.message);
+    case NotWritten::File:
+        return tell(u"קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."_s,
+                    u"A file of the order could not be written. What was prepared so far is kept."_s, failure.message);
+    case NotWritten::Counter:
+        return tell(u"מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."_s,
+                    u"The number of the next order could not be stored. This order goes on."_s, failure.message);
+    case NotWritten::Log:
+        return tell(u"לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
+                    u"The order's details can't be written, so the order was not sent. What was prepared is kept. "
+                    u"Put it right, then try again."_s,
+                    failure.message);
+    }
+}
+
+void PreparationPage::filesNotWritten(int count) {
+    tell(u"%1 קבצים של ההזמנה לא נכתבו."_s.arg(count), u"%1 files of the order could not be written."_s.arg(count));
 }
 
 QString PreparationPage::listText() const {

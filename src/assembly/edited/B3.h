@@ -1,7 +1,7 @@
 #pragma once
 
 #include "assembly/PreparationPage.h"
-#include "assembly/edited/EditedPrints.h"
+#include "assembly/edited/EditedPreparation.h"
 #include "common/PaperSize.h"
 #include "session/Ticker.h"
 
@@ -52,16 +52,12 @@ private:
     void setPreparing(bool on) override;
     void prepare();
     void stopAndLeave();
-    void listNames();
-    bool prepareOrder();
-    void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
-    Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
-    Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
-    void saveThumbnail(const BasketLine& line, const DrivePath& scratch);
-    bool buildOrderSheet();
+    void reached(Stage stage, int position) override;
+    void printed(const Bitmap& small) override;
+    void sheetDrawn(const Bitmap& sheet) override;
 
+    EditedPreparation m_preparation;
     std::optional<PaperSize> m_paper; // as it was when the page was loaded
-    DrivePath m_jobFolder;
 };
 
 } // namespace lumora

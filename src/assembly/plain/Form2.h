@@ -1,7 +1,7 @@
 #pragma once
 
-#include "assembly/OrderSheet.h"
 #include "assembly/PreparationPage.h"
+#include "assembly/plain/PlainPreparation.h"
 
 #include <QPoint>
 
@@ -60,8 +60,6 @@ public:
     bool isTroubleShown() const { return Label4fail.visible || Label4removed.visible; }
 
 private:
-    class Prints;
-
     PreparationControls& shared() override { return *this; }
     void start(); // drops what is no JPEG, lets the page paint, then prepares
     void prepare();
@@ -71,10 +69,7 @@ private:
     void keepOnlyJpeg();
     void setPreparing(bool on) override;
     void showProgress() override;
-    bool isAlbum() const;
-    bool drawSheet(SheetKind kind);
-    bool prepareOrder();
-    void packPicture(int index, PrintPacker& packer, Prints& prints);
+    void sheetDrawn(const Bitmap& sheet) override;
 
     void drawAlbumSheet(); // to look at
     void redrawSheet();
@@ -84,6 +79,7 @@ private:
     void dragSheet(QPoint at);
     void dropSheet();
 
+    PlainPreparation m_preparation;
     std::optional<QPoint> m_dragFrom;
 };
 

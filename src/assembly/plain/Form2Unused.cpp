@@ -6,19 +6,19 @@ namespace lumora {
 void Form2::drawAlbumSheet() {
     if (isPreparing())
         return;
-    countTotal();
+    m_preparation.count(List1.items());
     drawToLookAt(SheetKind::Album);
 }
 
 void Form2::redrawSheet() {
-    drawToLookAt(isAlbum() ? SheetKind::Album : SheetKind::Plain);
+    drawToLookAt(m_preparation.isAlbum() ? SheetKind::Album : SheetKind::Plain);
 }
 
 void Form2::drawToLookAt(SheetKind kind) {
     if (isPreparing())
         return;
     setPreparing(true);
-    const bool goOn = drawSheet(kind);
+    const bool goOn = m_preparation.drawSheet(kind, List1.items()).has_value();
     setPreparing(false);
     if (goOn)
         setStage(Stage::Waiting);

@@ -1,0 +1,109 @@
+#include "assembly/Preparation.h"
+
+#include "order/PrintCode.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+void Preparation::count(const QStringList& lines) {
+    m_state.shemot.TotalPics = sumOfCopies(lines, CopiesIn::BasketLines);
+    m_events.counted();
+}
+
+void Preparation::begin(const QStringList& lines) {
+    m_lines = lines;
+    m_failed.clear();
+    m_writeFailures = 0;
+    m_state.transfer.MailFlag = 0;
+    count(m_lines);
+}
+
+bool Preparation::claimFolder(OrderFolder::Ending ending) {
+    const Files& files = m_platform.files;
+    if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
+        for (const QString& name : files.names(m_folder->path(), u"*.jpp"_s))
+            static_cast<void>(files.removeFile(m_folder->filePath(name)));
+        return true;
+    }
+    const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
+    if (!claimed) {
+        m_events.notWritten(PreparationEvents::NotWritten::Folder, claimed.failure());
+        return false;
+    }
+    m_folder = *claimed;
+    m_state.transfer.OrderFolder = claimed->path();
+    return true;
+}
+
+bool Preparation::forEachPicture(const std::function<void(int)>& step) {
+    for (int i = 0; i < m_lines.size(); ++i) {
+        m_events.reached(PreparationStage::Pictures, i + 1);
+        step(i);
+        if (!m_events.yield())
+            return false;
+    }
+    if (m_writeFailures > 1)
+        m_events.filesNotWritten(m_writeFailures);
+    return true;
+}
+
+bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
+                       const std::function<Result<QByteArray>()>& picture) {
+    const PrintPacker::Outcome outcome = packer.pack(line, picture);
+    if (!outcome.packed)
+        notPrepared(line.path);
+    if (outcome.writeFailure)
+        notWritten(*outcome.writeFailure);
+    return outcome.packed;
+}
+
+void Preparation::notPrepared(const DrivePath& picture) {
+    m_failed += picture.text();
+    m_events.notPrepared(picture);
+}
+
+// On a full disk every picture fails in the same way.
+void Preparation::notWritten(const Failure& failure) {
+    if (m_writeFailures++ == 0)
+        m_events.notWritten(PreparationEvents::NotWritten::File, failure);
+}
+
+std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& lines, const QStringList& texts,
+                                             const std::vector<SheetCell>& cells) {
+    OrderSheet sheet(kind, orderSheetSize(kind, static_cast<int>(lines.size())), orderSheetBackground(kind, m_state));
+    sheet.drawLines(texts);
+    m_events.reached(PreparationStage::Sheet, 0);
+    bool goOn = true;
+    sheet.drawContactSheet(cells, [&](int i) {
+        m_events.reached(PreparationStage::Sheet, i + 1);
+        return goOn = m_events.yield();
+    });
+    if (!goOn)
+        return std::nullopt;
+    m_events.sheetDrawn(sheet.bitmap());
+    return sheet.bitmap();
+}
+
+void Preparation::countOrder() {
+    m_events.reached(PreparationStage::Closing, 0);
+    if (const Result<void> counted = Workspace(m_state, m_platform.files).writeCounter(); !counted)
+        m_events.notWritten(PreparationEvents::NotWritten::Counter, counted.failure());
+}
+
+bool Preparation::writeLog(OrderLog::Layout layout) {
+    const QByteArray log = OrderLog::of(m_state, layout, m_lines, m_failed, m_platform.clock.now()).write();
+    if (const Result<void> logged = m_platform.files.writeWhole(m_folder->logPath(), log); !logged) {
+        m_events.notWritten(PreparationEvents::NotWritten::Log, logged.failure());
+        return false;
+    }
+    m_state.transfer.OrderLogBase = m_folder->logBase();
+    return true;
+}
+
+} // namespace lumora

@@ -1,0 +1,116 @@
+#include "assembly/edited/EditedPreparation.h"
+
+#include "common/FixedText.h"
+#include "imaging/files/BmpFile.h"
+#include "order/EditRecord.h"
+#include "order/PrintFileName.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int previewWidth = 300;
+
+} // namespace
+
+EditedPreparation::EditedPreparation(SessionState& state, const Platform& platform, PreparationEvents& events)
+    : Preparation(state, platform, events)
+    , m_jobFolder(WorkspacePaths::jobFolder(state)) {}
+
+void EditedPreparation::makeJobFolder() const {
+    for (const DrivePath& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
+        if (!m_platform.files.folderExists(path))
+            static_cast<void>(m_platform.files.makeFolder(path));
+    }
+}
+
+bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSize> paper) {
+    begin(lines);
+    if (!claimFolder(OrderFolder::Ending::Plain))
+        return false;
+    PrintPacker packer(m_state, m_platform.files, *m_folder, OrderTail::shortWidth);
+    {
+        EditedPrints prints(m_state, m_platform.files, m_lines, paper);
+        if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
+            return false;
+    }
+    countOrder();
+    if (!drawSheet())
+        return false;
+    m_events.reached(PreparationStage::Closing, 0);
+    return writeLog(OrderLog::Layout::Edited);
+}
+
+void EditedPreparation::preparePicture(int index, PrintPacker& packer, EditedPrints& prints) {
+    const BasketLine line = BasketLine::split(m_lines[index], LineForm::Full);
+    packer.beginStep();
+    if (!line.hasUsableName())
+        return;
+    m_events.inWork(line.path);
+    if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
+        saveThumbnail(line, packer.scratch());
+    packer.removeScratch();
+}
+
+Result<QByteArray> EditedPreparation::renderPicture(const BasketLine& line, EditedPrints& prints) {
+    EditedPrintResult made = prints.next([this] { m_platform.pump.pump(); });
+    if (made.toneCopy) {
+        if (const Result<void> kept = keepToneCopy(line, *made.toneCopy); !kept) {
+            notWritten(kept.failure());
+            return kept.failure();
+        }
+    }
+    return made.jpeg;
+}
+
+// The copy of a corrected picture is looked for among the red-eye copies too, under the name of the copy itself.
+Result<void> EditedPreparation::keepToneCopy(const BasketLine& line, NewContent& copy) {
+    EditFields edit;
+    UnpackEditState(line.editState, edit);
+    if (Result<void> kept = copy.commit(NewContent::Durability::Passing); !kept)
+        return kept;
+    if (edit.RedMarker != EditRecord::corrected)
+        return {};
+    const DrivePath path = WorkspacePaths::toneCopy(m_state);
+    return m_platform.files.copyFile(path, WorkspacePaths::corrected(m_state, path));
+}
+
+// Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
+void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& scratch) {
+    const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
+    const DrivePath path = m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + u".bmp"_s);
+    const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
+    const Result<PictureSize> size =
+        source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch.text()};
+    if (!size || !target)
+        return;
+    const auto height = static_cast<int>(RoundHalfEven(static_cast<double>(previewWidth) * size->height / size->width));
+    const Result<Bitmap> preview = loadPictureScaled(*source, {previewWidth, std::max(1, height)});
+    if (!preview)
+        return;
+    m_events.printed(*preview);
+    NewContent thumbnail(*target, path.text());
+    appendBmp(*preview, thumbnail, [] { return false; });
+    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
+}
+
+std::optional<Bitmap> EditedPreparation::drawSheet() {
+    std::vector<SheetCell> cells;
+    for (const QString& name : m_platform.files.names(m_jobFolder, u"*.bmp"_s)) {
+        // Twice the last four characters: of the ending and of the name itself.
+        const QString caption = name.left(std::max<qsizetype>(0, name.size() - 8));
+        cells.push_back({m_platform.files.drives().toHost(m_jobFolder / name), caption});
+    }
+    return Preparation::drawSheet(SheetKind::Edited, m_lines, editedSheetLines(m_state, m_platform.clock.now()), cells);
+}
+
+} // namespace lumora

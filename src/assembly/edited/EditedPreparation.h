@@ -1,0 +1,29 @@
+#pragma once
+
+#include "assembly/Preparation.h"
+#include "assembly/edited/EditedPrints.h"
+
+namespace lumora {
+
+// Prepares an edited order: each picture is rendered with all that its record says, and the order sheet is drawn from
+// the rendered prints.
+class EditedPreparation : public Preparation {
+public:
+    EditedPreparation(SessionState& state, const Platform& platform, PreparationEvents& events);
+
+    // The folder of the sheet's pictures. Without it the sheet has none, and the order goes on.
+    void makeJobFolder() const;
+    // False, and told, when the order is not whole, or when a click ended the program.
+    bool prepare(const QStringList& lines, std::optional<PaperSize> paper);
+
+private:
+    void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
+    Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
+    Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
+    void saveThumbnail(const BasketLine& line, const DrivePath& scratch);
+    std::optional<Bitmap> drawSheet();
+
+    const DrivePath m_jobFolder;
+};
+
+} // namespace lumora

@@ -1,0 +1,139 @@
+#include "assembly/plain/PlainPreparation.h"
+
+#include "assembly/PaperResize.h"
+#include "assembly/WorkAhead.h"
+#include "common/FixedText.h"
+#include "common/PaperSize.h"
+#include "order/BasketLine.h"
+#include "order/OrderNames.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "session/TextList.h"
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+BasketLine split(const QString& line) {
+    return BasketLine::split(line, LineForm::Short);
+}
+
+// Either spelling of the camera and no other: what else there is was picked with a whole folder.
+bool isJpegItem(const QString& item) {
+    const QString ending = item.right(3);
+    return ending == u"JPG" || ending == u"jpg";
+}
+
+} // namespace
+
+// The prints of the order, scaled ahead of the step that packs them; only a source path goes into that work and only
+// bytes come out.
+class PlainPreparation::Prints {
+public:
+    Prints(const SessionState& state, const Files& files, const QStringList& items)
+        : m_files(files)
+        , m_paper(PaperSize::ofText(state.shemot.ppr))
+        , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items))
+        , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
+
+    // The print of the next picture that is to be scaled.
+    template <class Waiting>
+    Result<QByteArray> next(Waiting whileWaiting) {
+        return m_prints.take(whileWaiting);
+    }
+
+private:
+    using Ahead = WorkAhead<Result<QByteArray>>;
+
+    static QList<DrivePath> sourcesToScale(const QStringList& items) {
+        QList<DrivePath> sources;
+        for (const QString& item : items) {
+            const BasketLine picture = split(item);
+            if (picture.hasUsableName() && !HasQuestionMark(item))
+                sources += picture.path;
+        }
+        return sources;
+    }
+
+    Ahead::Work scaling(const DrivePath& path) const {
+        const std::optional<HostPath> source = m_files.drives().toHost(path);
+        return [source, paper = m_paper]() -> Result<QByteArray> {
+            if (!source || !paper)
+                return Failure{Failure::Kind::NotFound, {}};
+            return resizeToPaper(*source, *paper);
+        };
+    }
+
+    const Files& m_files;
+    const std::optional<PaperSize> m_paper;
+    const QList<DrivePath> m_sources;
+    Ahead m_prints;
+};
+
+void PlainPreparation::keepOnlyJpeg(TextList& lines, TextList& removed) {
+    for (int i = 0; i < lines.count(); ++i) {
+        if (isJpegItem(lines.item(i)))
+            continue;
+        removed.append(split(lines.item(i)).path.text());
+        lines.removeAt(i);
+    }
+}
+
+bool PlainPreparation::isAlbum() const {
+    return m_state.Optint == OrderKind::Album;
+}
+
+std::optional<Bitmap> PlainPreparation::drawSheet(SheetKind kind, const QStringList& lines) {
+    const QDateTime now = m_platform.clock.now();
+    std::vector<SheetCell> cells;
+    for (const QString& line : lines)
+        cells.push_back({m_platform.files.drives().toHost(split(line).path),
+                         split(line).copiesField() + u'_' + RightPart(split(line).path.stem(), 9)});
+    return Preparation::drawSheet(
+        kind, lines, kind == SheetKind::Album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now), cells);
+}
+
+bool PlainPreparation::prepare(const QStringList& lines) {
+    begin(lines);
+    // Before the sheet is drawn: it shows the number.
+    if (!claimFolder(OrderFolder::Ending::BySession))
+        return false;
+    const std::optional<Bitmap> drawn = drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain, m_lines);
+    if (!drawn)
+        return false;
+    const DrivePath sheetPath = m_folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, u".jpp"_s));
+    const Result<QByteArray> sheet = encodeJpeg(*drawn, printQuality);
+    const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
+    if (!saved)
+        notWritten(saved.failure());
+
+    PrintPacker packer(m_state, m_platform.files, *m_folder, m_state.SugTzad);
+    Prints prints(m_state, m_platform.files, m_lines);
+    if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
+        return false;
+    countOrder();
+    return writeLog(isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
+}
+
+void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& prints) {
+    const BasketLine line = split(m_lines[index]);
+    packer.beginStep();
+    if (!line.hasUsableName())
+        return;
+    // What the selection page leaves of a name that the code page can't carry.
+    if (HasQuestionMark(m_lines[index])) {
+        notPrepared(line.path);
+        return;
+    }
+    m_events.inWork(line.path);
+    pack(packer, {index, line.code, line.path}, [&] {
+        return m_state.DchisaAmoka == 1 ? m_platform.files.read(line.path)
+                                        : prints.next([this] { m_platform.pump.pump(); });
+    });
+}
+
+} // namespace lumora

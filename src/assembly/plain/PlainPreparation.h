@@ -1,0 +1,30 @@
+#pragma once
+
+#include "assembly/Preparation.h"
+
+namespace lumora {
+
+class TextList;
+
+// Prepares a plain order: each picture is scaled to the paper, or copied as it is where deep compression is on.
+class PlainPreparation : public Preparation {
+public:
+    using Preparation::Preparation;
+
+    // Moves what is no JPEG to removed. The walk steps on after a removal, so that the line behind a removed one is not
+    // looked at until the next walk: the lab knows the lists that come of it.
+    static void keepOnlyJpeg(TextList& lines, TextList& removed);
+
+    bool isAlbum() const;
+    // No value when a click ended the program.
+    std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines);
+    // False, and told, when the order is not whole, or when a click ended the program.
+    bool prepare(const QStringList& lines);
+
+private:
+    class Prints;
+
+    void packPicture(int index, PrintPacker& packer, Prints& prints);
+};
+
+} // namespace lumora
