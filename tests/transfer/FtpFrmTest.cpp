@@ -261,6 +261,17 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
     EXPECT_EQ(rig.page().controls().AllDone, 1);
 }
 
+TEST_F(FtpFrmTest, OpensTheHiddenAreaOnlyWhereTheLabAllowsIt) {
+    for (const bool allowed : {true, false}) {
+        FtpFrmRig other(lab);
+        other.state.OperatorArea = allowed;
+        FtpFrm& page = other.start();
+        EXPECT_EQ(page.controls().Command24.visible, allowed);
+        page.Command24_Click();
+        EXPECT_EQ(page.controls().Frame2.visible, allowed);
+    }
+}
+
 TEST_F(FtpFrmTest, ShowsTheDeliveryNoteForHomeOrdersAlone) {
     EXPECT_FALSE(rig.start().controls().Label15.visible);
     FtpFrmRig home(lab);

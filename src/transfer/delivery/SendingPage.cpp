@@ -42,10 +42,10 @@ void SendingPage::activateWhenFree() {
     if (m_platform.pump.pumping())
         QTimer::singleShot(whileAPumpRuns, this, &SendingPage::activateWhenFree);
     else
-        Form_Activate();
+        activate();
 }
 
-void SendingPage::Form_Activate() {
+void SendingPage::activate() {
     if (m_activated)
         return;
     m_activated = true;

@@ -27,7 +27,7 @@ struct SendingGauge {
 class SendingPage : public Page {
     Q_OBJECT
 public:
-    void Form_Activate(); // the page has come to the front
+    void Form_Activate() { activate(); } // the page has come to the front
 
     SendingPhase phase() const { return m_phase; }
     const PhaseLook& look() const;
@@ -68,6 +68,7 @@ protected:
 
 private:
     void activateWhenFree();
+    void activate();
 
     SendingControls& m_shown;
     SendingPhase m_phase = SendingPhase::Preparing;

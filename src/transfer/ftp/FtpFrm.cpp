@@ -33,6 +33,7 @@ void FtpFrm::load() {
     chkPassive.checked = true;
     optBin.checked = true;
     Command22.visible = m_state.transfer.SugMishloah == Sending::Chain;
+    Command24.visible = m_state.OperatorArea;
     FtpEnableControls(false);
     showSeconds();
     Timer2.start();
@@ -259,7 +260,7 @@ void FtpFrm::openOrderFolder() {
 }
 
 void FtpFrm::showLabArea(bool shown) {
-    Frame2.visible = shown;
+    Frame2.visible = shown && m_state.OperatorArea;
     Q_EMIT changed();
 }
 

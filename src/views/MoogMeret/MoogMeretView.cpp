@@ -22,6 +22,7 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
 QWidget* MoogMeretView::makeOrders() {
     m_orders = list(c.List3, &MoogMeret::List3_Click,
                     [&page = m_page](const QString& name) { return page.orderRow(name).text; });
+    m_orders->setProperty("names", true); // the date beside the number is seen whole
     m_orders->setTextElideMode(Qt::ElideRight);
     const Card card = makeCard("card", Pad::Normal);
     bind(card.frame, c.Picture3);

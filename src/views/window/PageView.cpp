@@ -327,10 +327,6 @@ void PageView::bind(const QString& name, QWidget* widget, std::function<QString(
     m_controls.push_back({name, widget, nullptr, nullptr, std::move(text)});
 }
 
-void PageView::bindHidden(const QString& name, const Caption& caption) {
-    m_controls.push_back({name, nullptr, &caption, nullptr, {}});
-}
-
 void PageView::bindList(const QString& name, const TextList& list, QWidget* widget, Reading reading) {
     if (widget)
         widget->setObjectName(name);

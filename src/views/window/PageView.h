@@ -133,8 +133,6 @@ protected:
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
     // The widget has the control's name; the view itself renders what it says.
     void bindName(QWidget* widget, const Caption& caption);
-    // What has a name and is not seen, of a page whose controls carry no names.
-    void bindHidden(const QString& name, const Caption& caption);
     void bindList(const QString& name, const TextList& list, QWidget* widget = nullptr, Reading reading = {});
     void bindList(QWidget* widget, const TextList& list, Reading reading = {}) {
         bindList(m_page.controls().nameOf(list), list, widget, std::move(reading));
@@ -212,10 +210,5 @@ protected:
 
 // The picture at a drive path, null where there is none.
 QImage loadedPicture(const Files& files, const DrivePath& path);
-
-// The control of an array: "Command4Snif(3)".
-inline QString numbered(const char* name, std::size_t index) {
-    return QStringLiteral("%1(%2)").arg(QLatin1StringView(name)).arg(index);
-}
 
 } // namespace lumora
