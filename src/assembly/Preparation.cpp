@@ -29,7 +29,10 @@ bool Preparation::claimFolder(OrderFolder::Ending ending) {
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
         for (const QString& name : files.names(m_folder->path(), u"*.jpp"_s))
             static_cast<void>(files.removeFile(m_folder->filePath(name)));
-        return true;
+        const Result<void> made = makeOrderFolder(files, *m_folder); // somebody may have removed it meanwhile
+        if (!made)
+            m_events.notWritten(PreparationEvents::NotWritten::Folder, made.failure());
+        return made.ok();
     }
     const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
     if (!claimed) {

@@ -37,6 +37,11 @@ TEST(SampleColorLevels, SortsItsValuesAsTextsSoThatTheBrightestComeLast) {
         EXPECT_NEAR(flat.gains()[0], c.gain, c.gain * 1e-5);
         EXPECT_FLOAT_EQ(flat.floors(10)[0], c.floor);
     }
+    const SampleColorLevels coloured(Bitmap(60, 40, QColor(200, 50, 5)), {5, 5, 50, 30});
+    EXPECT_FLOAT_EQ(coloured.topLevels()[1], 50.2F);
+    EXPECT_FLOAT_EQ(coloured.topLevels()[2], 5.2F);
+    EXPECT_FLOAT_EQ(coloured.floors(10)[1], 60);
+    EXPECT_FLOAT_EQ(coloured.floors(10)[2], 15);
 }
 
 class WorkSurfaces : public ::testing::Test, protected PageRig {

@@ -1,6 +1,6 @@
-// Loaded in front of a program by LD_PRELOAD. Its lines are given up after a LIMITS-th of the time they are allowed,
-// and its monotonic clock runs CLOCK times as fast: MATRIX_LIMITS and MATRIX_CLOCK in the environment, 1 where they are
-// missing.
+// Loaded in front of a program by LD_PRELOAD. Its monotonic clock, its waits and the limits of its sockets run
+// MATRIX_CLOCK times as fast; at rename MATRIX_KILL the program is killed, before it or, if the number is negative,
+// behind it.
 #include <dlfcn.h>
 #include <poll.h>
 #include <sys/socket.h>
@@ -24,7 +24,8 @@ long number(const char* name) {
 const long hurry = std::max(1L, number("MATRIX_CLOCK"));
 const long killAt = number("MATRIX_KILL");
 std::atomic<long> renames = 0;
-constexpr long second = 1'000'000'000; // nanoseconds
+constexpr long second = 1'000'000'000;     // nanoseconds
+constexpr time_t calendar = 1'000'000'000; // seconds; a later deadline is one of the calendar's clock
 
 timespec divided(const timespec& time, long by) {
     const long long all = (static_cast<long long>(time.tv_sec) * second + time.tv_nsec) / by;
@@ -72,7 +73,7 @@ int setsockopt(int socket, int level, int option, const void* value, socklen_t s
 
 // The deadlines are times of the monotonic clock above; those of the calendar are far larger.
 int pthread_cond_timedwait(pthread_cond_t* condition, pthread_mutex_t* mutex, const timespec* deadline) {
-    const timespec real = deadline->tv_sec < second ? divided(*deadline, hurry) : *deadline;
+    const timespec real = deadline->tv_sec < calendar ? divided(*deadline, hurry) : *deadline;
     return next<decltype(pthread_cond_timedwait)>("pthread_cond_timedwait")(condition, mutex, &real);
 }
 

@@ -223,10 +223,14 @@ class Case:
         self.seconds = time.time() - self.begun
         lie = 'LIE' in self.text or 'no report' in self.text
         self.good = not self.found and not re.search('STILL|EARLY|by resend (told|whole)', self.text) and \
-            (not lie or bool(self.fault.literal))
+            (not lie or bool(self.fault.literal)) and (not self.survived() or self.text == 'arrived whole')
         if self.good:
             shutil.rmtree(self.folder, ignore_errors=True)
         return self
+
+    def survived(self):
+        """Without a fault, and with Careful behind one that comes once, the order arrives at the first sending."""
+        return self.fault.name == 'no fault' or (self.careful and self.fault.name.endswith(', once'))
 
     def play_case(self):
         ended = self.play('plain' if self.way == 'ftp' else 'edited', self.way)

@@ -79,7 +79,8 @@ std::optional<QString> redirectTarget(const Address& from, const QString& locati
     } else if (url.startsWith(u'/')) {
         url.prepend(host);
     } else if (!url.contains(QStringLiteral("://"))) {
-        const QByteArray path = from.target.left(from.target.indexOf('?'));
+        const qsizetype query = from.target.indexOf('?');
+        const QByteArray path = query < 0 ? from.target : from.target.left(query);
         url = host + AnsiCodePage::decode(path.left(path.lastIndexOf('/') + 1)) + url;
     }
     const auto to = addressOf(url);

@@ -97,6 +97,8 @@ void HttpSender::post(const QString& path) {
     m_events.reached(SendingMoment::Answered);
     if (m_script.failed()) {
         m_allPosted = false;
+        if (m_stop.left) // the customer has cut it
+            return;
         m_events.failed(m_script.failedBeforeSending() ? LineStep::File : LineStep::Put, m_script.lastFailure(),
                         LeafName(path));
     } else {

@@ -155,6 +155,7 @@ TEST_F(HttpTest, FollowsRedirectsToTheSameHostAndTakesNoAnswerThatIsShort) {
     } cases[] = {
         {"301", false, {redirect(301, "/new?a=1"), there}, "there", 2, "GET /new?a=1 HTTP/1.1\r\n"},
         {"302, beside it", false, {redirect(302, "new"), there}, "there", 2, "GET /a/new HTTP/1.1\r\n"},
+        {"302, twice beside it", false, {redirect(302, "new"), redirect(302, "b/c"), there}, "there", 3, "GET /a/b/c "},
         {"307", false, {redirect(307, "/new"), there}, "there", 2, "GET /new "},
         {"five", false, QByteArrayList(5, redirect(301, "/new")) << there, "there", 6, "GET /new "},
         {"without end", false, {redirect(301, "/new")}, nullptr, 6, "GET /new "},
