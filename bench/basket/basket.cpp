@@ -11,7 +11,7 @@ namespace {
 using namespace lumora;
 
 constexpr int pictures = 5000;
-const QString folder = QStringLiteral("E:\\DCIM\\100CAMERA\\חופשה בצפון");
+const DrivePath folder(QStringLiteral("E:\\DCIM\\100CAMERA\\חופשה בצפון"));
 
 QStringList names() {
     QStringList list;

@@ -91,7 +91,7 @@ public:
                                                               const QString& password, DataChannel channel) = 0;
 
     // Cuts every connection that stands; each call under way fails at once, and a put that was cut is a broken put.
-    // May be called from any thread; later calls work again.
+    // From any thread. Later calls are not concerned.
     virtual void abort() {}
     // While a pump is given, a call that waits on its thread pumps, so that a click may abort it.
     virtual void pumpWhileWaiting(EventPump*) {}

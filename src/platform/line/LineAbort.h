@@ -8,15 +8,15 @@
 
 namespace lumora {
 
-// Cuts the sockets of a line from another thread than the one that waits on them. The other side sees the end of the
-// data: the part of a file that has arrived may look whole there, and whoever put it keeps it as broken.
+// Cuts the sockets of a line from another thread than the one that waits on them. The other side sees a reset, so that
+// it does not take the part of a file for the whole.
 class LineAbort {
 public:
     LineAbort() = default;
     LineAbort(const LineAbort&) = delete;
     LineAbort& operator=(const LineAbort&) = delete;
 
-    // Cuts every watched socket, but none that is watched later.
+    // Cuts every watched socket. Those that are watched later are not concerned.
     void abort();
     // How often abort() was called; a dialogue that began at another count has been cut.
     int count() const { return m_count; }
