@@ -9,7 +9,7 @@ struct Deployment;
 struct Platform;
 struct SessionState;
 
-// Which pages there are, and which view shows each.
+// Register all pages, and the view that shows each.
 void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment);
 void registerViews(MainWindow& window, PageChain& chain, SessionState& state, const Files& files);
 

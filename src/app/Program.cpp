@@ -35,7 +35,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-// In the order in which each stands on those before it.
+// Each member uses only those above it.
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line)
         : deployment(std::move(read))
@@ -74,7 +74,7 @@ struct Program::Parts {
 
 namespace {
 
-// Only there a program may raise its own window.
+// Only under X11 may a program raise its own window.
 bool displayAllowsRaising() {
     return QGuiApplication::platformName() == QLatin1String("xcb");
 }
@@ -118,7 +118,8 @@ Result<void> Program::start() {
         return Failure{Failure::Kind::AccessDenied, u"%1: the data folder can't be made: %2"_s.arg(
                                                         toText(dataFolder), QString::fromStdString(error.message()))};
     }
-    // A folder that stood there already may serve others too, and keeps its rights; what is made in it is closed.
+    // A folder that existed before keeps its permissions, since others may use it; the folders that the program makes
+    // in it are closed to others.
     if (made)
         std::filesystem::permissions(dataFolder, std::filesystem::perms::owner_all, error);
 
@@ -138,7 +139,7 @@ Result<void> Program::start() {
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     registerViews(parts.window, parts.chain, parts.state, parts.files);
-    // The process ends with the event loop, which may be one of a question: each of them has to come back.
+    // A question may run an event loop of its own; each of them has to return before the process ends.
     QObject::connect(
         &parts.chain, &PageChain::ended, qApp, [] { QCoreApplication::exit(0); }, Qt::QueuedConnection);
 

@@ -18,8 +18,8 @@ struct Platform;
 struct SessionState;
 
 struct ProgramOptions {
-    std::optional<HostPath> labFile;    // the deployment file; without one the usual places are looked through
-    std::optional<HostPath> dataFolder; // what stands behind the program's own drive letter
+    std::optional<HostPath> labFile;    // the deployment file; without one the usual places are searched
+    std::optional<HostPath> dataFolder; // the folder behind the program's own drive letter
     QSize windowSize;                   // an empty one leaves the size to the screen
     bool fullScreen = false;
     bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
@@ -27,7 +27,7 @@ struct ProgramOptions {
 };
 
 // One run of the program: the session, the machine, the chain of pages and the window. Needs an Application (in
-// views/). A program that presses controls instead of a person runs the very same.
+// views/). A program that presses the controls in place of a person uses this class too.
 class Program {
 public:
     explicit Program(ProgramOptions options);
@@ -35,12 +35,12 @@ public:
     Program(const Program&) = delete;
     Program& operator=(const Program&) = delete;
 
-    // Reads the deployment file, opens the window and brings the start page to the front. A failure tells file,
-    // line, key and what is allowed, and no window was opened then; InUse: another run has the data folder. The end of
-    // the page chain quits the application.
+    // Reads the deployment file, opens the window and brings the start page to the front. After a failure no window is
+    // open. A failure of the file names file, line, key and what is allowed; InUse: another run has the data folder.
+    // The end of the page chain quits the application.
     Result<void> start();
 
-    // Behind an InUse: the other run has been asked to come to the front, and its display lets it.
+    // After InUse: the other run was asked to come to the front, and its display allows that.
     bool otherCameForward() const { return m_otherCameForward; }
 
     // Valid once start() has succeeded.

@@ -20,7 +20,8 @@ struct SocketName {
     const sockaddr* any() const { return reinterpret_cast<const sockaddr*>(&address); }
 };
 
-// A name that begins with a zero byte stands in no folder. Device and inode tell the folder by whatever path.
+// A socket name that begins with a zero byte makes no file (Linux). Device and inode identify the data folder,
+// whichever path leads to it.
 SocketName socketOf(const HostPath& dataFolder) {
     SocketName name;
     struct stat folder {};

@@ -10,11 +10,11 @@ class QSocketNotifier;
 
 namespace lumora {
 
-// The call of a second start to the run that has the data folder: come to the front. It goes through a local socket of
-// the kernel that is named after the folder's file and leaves nothing on the disk.
+// A second start of the program asks the run that has the data folder to come to the front. The call goes through a
+// local socket that is named after the folder's device and inode and leaves no file on the disk.
 class ForwardCalls {
 public:
-    // Calls come through the event loop for as long as the object lives.
+    // The event loop delivers calls for as long as the object lives.
     ForwardCalls(const HostPath& dataFolder, std::function<void()> called);
     ~ForwardCalls();
 
@@ -23,7 +23,7 @@ private:
     std::unique_ptr<QSocketNotifier> m_notifier;
 };
 
-// True if a run of this data folder takes such calls and has been called.
+// True if a run of this data folder accepts such calls and has been called.
 bool CallForward(const HostPath& dataFolder);
 
 } // namespace lumora

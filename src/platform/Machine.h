@@ -17,7 +17,7 @@ public:
     virtual QDateTime now() const = 0;
 };
 
-// Long loops call it: pending events are handled and the page is painted, so a click or a timer may run inside.
+// Long loops call pump(): it handles pending events and paints the page, so a click or a timer may run inside.
 class EventPump {
 public:
     virtual ~EventPump() = default;

@@ -21,7 +21,8 @@ namespace fs = std::filesystem;
 
 constexpr int addressLength = 6; // bytes
 
-// The address that the card was made with: the present one may be random while a wireless card looks for networks.
+// The address that the manufacturer gave the card: the present one may be random while a wireless card looks for
+// networks.
 QString permanentAddress(const std::string& card) {
     // Command and length, then room for the longest address.
     alignas(ethtool_perm_addr) std::array<char, sizeof(ethtool_perm_addr) + 32> room = {};
@@ -57,7 +58,7 @@ QStringList NetworkCards(const HostPath& devices) {
     for (fs::directory_iterator at(devices, error), end; !error && at != end; at.increment(error)) {
         std::error_code none;
         const HostPath device = at->path() / "device";
-        if (!fs::exists(device, none)) // bridges, tunnels and containers' ends are made by programs
+        if (!fs::exists(device, none)) // bridges, tunnels and container interfaces have no hardware
             continue;
         QString address = permanentAddress(at->path().filename().native());
         if (isNone(address))

@@ -6,9 +6,8 @@
 namespace lumora {
 
 // The pauses of the transfer count rounds of painting and pumping, some 25,000 for each file sent, and have no clock.
-// If every round turned the event loop, a file would wait for seconds. So the loop turns at most once in this time,
-// counted from the end of the turn before; the other rounds only look at the clock. A person notices no delay that
-// short.
+// If every round ran the event loop, a file would wait for seconds. So the loop runs at most once in this time, counted
+// from the end of its last run; the other rounds only read the clock. A person does not notice so short a delay.
 constexpr qint64 betweenTurns = 8; // milliseconds
 
 void QtEventPump::pump() {

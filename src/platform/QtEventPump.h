@@ -12,7 +12,7 @@ public:
     bool pumping() const override { return m_depth > 0; }
 
 private:
-    QElapsedTimer m_sinceLast; // the end of the last turn of the event loop
+    QElapsedTimer m_sinceLast; // the end of the last run of the event loop
     int m_depth = 0;
 };
 

@@ -20,7 +20,7 @@ Page& PageChain::load(PageId id) {
     if (Page* existing = find(id))
         return *existing;
     assert(isRegistered(id));
-    // Held before load runs: a page that presses another's button from its load must be found.
+    // Kept before load() runs, so that load() can find its own page in the chain.
     Page& page = *(m_pages[id] = m_makers.at(id)());
     page.load();
     page.setTexts();

@@ -11,7 +11,8 @@ namespace lumora {
 
 class EventPump;
 
-// The chain of pages: which exist, which is in front. A page opens the next by its id and unloads itself.
+// The chain of pages: which exist, which is in front. A page tells what happened; the page flow says which page is
+// next.
 class PageChain : public QObject {
     Q_OBJECT
 public:

@@ -192,7 +192,7 @@ struct TransferState {
 // The lines that one page copies into a list of the next, and what it asks the next page to do with them.
 struct HandOver {
     QStringList lines;
-    bool pressStart = false; // the next page presses its own start button once it is shown
+    bool pressStart = false; // the next page starts its work by itself once it is shown
     QString notice;          // a line for the customer that the start page shows
 };
 

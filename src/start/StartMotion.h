@@ -2,8 +2,8 @@
 
 namespace lumora {
 
-// The three motions of the start page in pixels of a page 714 wide. A call is one step; the page's timers give the
-// pace.
+// The three motions of the start page, in pixels of a page 714 wide. Each call is one step; the page's timers call
+// them.
 class StartMotion {
 public:
     static constexpr int arrowTop = 400;
@@ -11,12 +11,12 @@ public:
     static constexpr int panelWidth = 230;
     static constexpr int pictureWidth = 265;
 
-    // Down by one, and from the bottom to the top again.
+    // Moves the arrow down by one pixel; from the bottom it returns to the top.
     void moveArrow();
-    // The advertising picture narrows to 4 and widens to pictureWidth again. It stands until it has been at a limit.
+    // Narrows the advertising picture to 4 pixels and widens it to pictureWidth again.
     void movePicture();
     void foldPanel() { m_panel = 5; }
-    // By 5; false once the panel is open.
+    // Opens the panel by 5 pixels more; false once it is open.
     bool unfoldPanel();
 
     int Label8Top() const { return m_arrow; }

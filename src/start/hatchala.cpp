@@ -43,12 +43,12 @@ void hatchala::setEnglish(bool english) {
     setTexts();
 }
 
-// --- the ways on ---
+// --- leaving the page ---
 
 void hatchala::startWith(const QString& code) {
     if (m_leaving)
         return;
-    // No tick may run behind a hand-over.
+    // No tick may run after the order has begun.
     m_timers.Timer4.stop();
     m_timers.Timer1.stop();
     m_timers.Timer2.stop();
@@ -69,7 +69,7 @@ void hatchala::startWithShop() {
         return;
     loadProfile();
     const QString phone = m_state.profile.Shops[static_cast<std::size_t>(row)].phone;
-    // The details page loads with the lab's own number for the first shop and with the shop's for the second.
+    // The details page loads with the lab's own telephone for the first shop and with the shop's for the second.
     if (row == 1)
         m_state.profile.LabPhone = phone;
     m_state.MishloachHabaita = false;
@@ -141,7 +141,7 @@ void hatchala::showProfile() {
     Label1.text = m_state.profile.LabMail;
 }
 
-// --- what moves and what explains ---
+// --- motion and help ---
 
 void hatchala::showHelp(Hover over) {
     if (over == m_over)
@@ -150,7 +150,7 @@ void hatchala::showHelp(Hover over) {
     const bool helps = over != Hover::Nothing;
     for (std::size_t i = 1; i < Image12.size(); ++i)
         Image12[i].visible = static_cast<std::size_t>(over) == i;
-    // In English the place of these pictures is taken by words.
+    // In English, words stand in place of these pictures.
     if (!m_state.english()) {
         Picture3.visible = helps;
         Picture2.visible = Image2.visible = !helps;
@@ -164,7 +164,7 @@ void hatchala::movePicture() {
         return;
     }
     m_timers.Timer2.setInterval(30);
-    // One that the installation placed there needs no fetch.
+    // A picture that the installation placed there is not fetched.
     if (Picture4.isEmpty()) {
         Picture4 = m_state.profile.AdFile1;
         Q_EMIT changed();

@@ -38,14 +38,14 @@ struct hatchalaControls : Controls {
     Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // the panel that asks for the shop
     Caption List1Caption{*this, u"List1Caption"};              // what is asked
     TextList List1{*this, u"List1"};                           // where the prints are fetched; row 0 is the first shop
-    Caption shopsBack{*this, u"shopsBack"};                    // puts the question off
-    Caption Picture2{*this, u"Picture2"};                      // decoration that gives way to a help picture
+    Caption shopsBack{*this, u"shopsBack"};                    // closes the question
+    Caption Picture2{*this, u"Picture2"};                      // decoration; a help picture takes its place
     Caption Image2{*this, u"Image2"};                          // the same
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
     ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
     DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
-    // Seen by nobody: two buttons that code presses, and the service panel with the settings as one line of text.
+    // Never shown: two buttons that code presses, and the service panel with the settings as one line of text.
     Caption Command1{*this, u"Command1", Caption::At::Hidden};
     Caption Command2{*this, u"Command2", Caption::At::Hidden};
     Caption Picture8{*this, u"Picture8", Caption::At::Hidden};
@@ -69,9 +69,9 @@ struct hatchalaTimers {
     Ticker Timer5; // moves the arrow
 };
 
-// The start page (hatchala, "beginning"): greets the customer, who begins an order here, goes to the price list or the
-// lab's site, turns the language, and says at which shop the prints are fetched where the lab asks for it. Each load
-// begins in Hebrew with the profile of the deployment.
+// hatchala, "the start page" in the glossary: the customer begins an order, opens the price list or the lab's site,
+// changes the language, and says at which shop the prints are fetched if the lab asks for it. Each load begins in
+// Hebrew with the profile of the deployment.
 class hatchala : public Page, private hatchalaControls {
     Q_OBJECT
 public:
@@ -82,7 +82,8 @@ public:
 
     // --- events ---
 
-    // The press hands over; the click comes only when the page stayed, and then the shop is still to be chosen.
+    // The order begins on the press. The click comes only if the page has stayed, and then the shop must still be
+    // chosen.
     void Image1_MouseDown() { startWith(QStringLiteral("KUP")); }
     void Image1_Click() { askForTheShop(); }
     void Image11_Click() { openPriceList(); }
@@ -93,14 +94,14 @@ public:
     void List1_Click(int row) { chooseShop(row); } // also when the row is chosen already
     void Command2_Click() { startWithShop(); }
     void Picture1_Escape() { putOffTheQuestion(); }
-    // Where the mouse, a finger or the keyboard is; what has no help counts as the bare page.
+    // The control under the mouse or the finger, or with the keyboard focus; Nothing for a control without help.
     enum class Hover { Nothing, Image1, Image11, Image5, Image3, Image6 };
     void MouseMove(Hover over) { showHelp(over); }
     void Timer2_Tick() { movePicture(); }
     void Timer3_Tick() { unfoldPanel(); }
     void Timer5_Tick() { moveArrow(); }
 
-    // No step of the page chain comes here: hatchalaUnused.cpp.
+    // No step of the page chain calls these; hatchalaUnused.cpp has them.
     void Command1_Click() { showSender(); }
     void Command3_Click() { fetchSettings(); }
     void Command4_Click() { scramble(); }
@@ -109,13 +110,14 @@ public:
     void Command8_Click() { SplitSettingsText(Label5.text); }
     void Timer1_Tick() { fetchPicture(); }
     void Timer4_Tick() { countDown(); }
-    // The start by the countdown.
+    // Begins an order at the end of the countdown.
     void StartAutomatically();
     // Builds the settings text of the profile, writes the settings file and shows both forms of it.
     void BuildSettingsText();
     // Fetches the remote copy to the settings file. After a failure there is no such file.
     void DownloadSettings();
-    // The lines of the settings file into List2; "No Server" for a file that is missing or is not this client's.
+    // Reads the lines of the settings file into List2; shows "No Server" if the file is missing or is not this
+    // client's.
     void ReadSettingsFile(const DrivePath& path);
     void SplitSettingsText(const QString& text);
 
@@ -127,9 +129,10 @@ public:
     const hatchalaTimers& timers() const { return m_timers; }
 
 Q_SIGNALS:
-    // --- what it tells: changed(), and ---
+    // --- signals, besides changed() ---
 
-    // A step of motion(), dozens of times a second: a view moves just that piece, as the page may wait for hours.
+    // Tells one step of motion(). It comes dozens of times a second, and the page may wait for hours, so a view moves
+    // only that piece.
     void moved();
 
 private:

@@ -1,5 +1,5 @@
-// What the start page has to have and no step of the program comes to: the service panel, the countdown, and the fetch
-// of the advertising picture.
+// What the start page must have and no step of the program reaches: the service panel, the countdown, and the fetch of
+// the advertising picture.
 #include "common/AnsiCodePage.h"
 #include "platform/Dialogs.h"
 #include "platform/files/Files.h"
@@ -15,7 +15,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// A settings text is one line; what a stranger's server sends in its place may be anything.
+// In bytes. A settings text is one line, but a foreign server may send anything in its place.
 constexpr qint64 largestSettingsFile = 1 << 16;
 
 } // namespace
@@ -42,7 +42,7 @@ void hatchala::countDown() {
 
 void hatchala::fetchPicture() {
     m_timers.Timer1.stop();
-    // A picture that does not come is no loss: one that is there already shows all the same.
+    // A failed fetch is ignored: a picture that is there already is shown.
     const auto target = m_platform.files.drives().toHost(m_state.profile.AdFile1);
     if (target && Workspace(m_state, m_platform.files).MakeRootFolders())
         (void)m_platform.internet.download(m_state.profile.AdUrl1, *target);
@@ -78,7 +78,7 @@ void hatchala::DownloadSettings() {
         return;
     const DrivePath path = settingsFile();
     (void)m_platform.files.removeFile(path);
-    // The caller learns of a failure from the file that is missing then.
+    // After a failure the file is missing, which tells the caller.
     if (const auto target = m_platform.files.drives().toHost(path))
         (void)m_platform.internet.download(
             u"http://%1/00natoonim/%2.txt"_s.arg(m_state.profile.SettingsHost, m_state.profile.ClientCode), *target);
@@ -113,7 +113,7 @@ void hatchala::fetchSettings() {
     Q_EMIT changed();
 }
 
-// Twice: the stored form is the text under the square of the substitution.
+// The scrambled form applies the substitution twice (docs/formats.md, Settings text).
 void hatchala::scramble() {
     Label5.text = Scramble(Scramble(Label5.text));
     Q_EMIT changed();

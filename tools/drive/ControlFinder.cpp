@@ -115,7 +115,7 @@ Result<const TextList*> listIn(const Result<PageView*>& view, const QString& pag
     return fail(u"%1 has no list %2"_s.arg(page, control));
 }
 
-// The widget that receives the press: of a list or a text area its viewport.
+// The widget that receives the press; for a list or a text area its viewport.
 QWidget& target(QWidget& widget) {
     auto* area = qobject_cast<QAbstractScrollArea*>(&widget);
     return area ? *area->viewport() : widget;
@@ -227,7 +227,7 @@ Result<void> ControlFinder::press(const QString& page, const QString& control) c
     if (!widget)
         return widget.failure();
     QWidget& hit = target(**widget);
-    // Of a tick box this is the box itself: its label may be drawn over the whole row.
+    // A tick box is pressed on its box, since its label may cover the whole row.
     click(hit, middleOf(hit));
     return {};
 }
@@ -296,7 +296,7 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
         return fail(u"%1.%2 can't be ticked"_s.arg(page, control));
     if (button->isChecked() != on) {
         const QRect box = button->rect();
-        // At the tick mark: a tick box reacts only inside its own contents.
+        // The press is at the tick mark: a tick box reacts only inside its own contents.
         click(*button,
               qobject_cast<QCheckBox*>(button)
                   ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())

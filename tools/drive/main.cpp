@@ -20,7 +20,7 @@ int complain(const QString& text, int status) {
     return status;
 }
 
-// An empty size if the text is none.
+// Returns an empty size if the text is no size.
 QSize sizeIn(const QString& text) {
     const QStringList sides = text.split(u'x');
     if (sides.size() != 2)

@@ -29,7 +29,7 @@ public:
     static HostPath defaultDataFolder();
 
     QChar programLetter() const { return m_programLetter; }
-    // As "C:\": the root of all workspace paths.
+    // The root of all workspace paths, as "C:\".
     DrivePath programRoot() const;
     const HostPath& dataFolder() const { return m_dataFolder; }
 

@@ -13,7 +13,7 @@ namespace lumora {
 namespace fs = std::filesystem;
 namespace {
 
-// No file of the program comes near; a larger one is an error.
+// In bytes. The program's own files are far smaller; reading a larger file is an error.
 constexpr qint64 largestRead = qint64(1) << 30;
 
 Failure failure(Failure::Kind kind, const DrivePath& path, const QString& reason) {

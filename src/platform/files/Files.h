@@ -24,7 +24,7 @@ public:
 
     // Succeeds when the folder exists. The parent must exist.
     Result<void> makeFolder(const DrivePath& path) const;
-    // True if this call made it, false if something of that name is there: of two programs one alone gets the true.
+    // True if this call made the folder, false if the name exists already: of two programs only one gets true.
     Result<bool> makeNewFolder(const DrivePath& path) const;
     Result<void> removeFile(const DrivePath& path) const;
 
@@ -37,7 +37,7 @@ public:
     // The same without the sync, for files written at every touch that are not needed after a crash of the machine.
     Result<void> writePassing(const DrivePath& path, const QByteArray& bytes) const;
 
-    // Copies by the same way. The source is opened for reading only.
+    // Copies in the same way. The source is opened for reading only.
     Result<void> copyFile(const DrivePath& source, const DrivePath& target) const;
 
     Result<qint64> size(const DrivePath& path) const;

@@ -47,7 +47,7 @@ Result<std::int32_t> MarkedVolume::serial(const DrivePath& driveRoot) const {
     if (!plain)
         return plain;
     std::optional<FolderMark> mark = readMark(m_file);
-    // Without a card nothing tells one machine from another.
+    // Without a network card one machine can't be told from another.
     const bool ours = mark && (m_cards.isEmpty() || mark->cards == m_cards);
     if (!ours) {
         mark = FolderMark{QRandomGenerator::system()->generate(), m_cards};

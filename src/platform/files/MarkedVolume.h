@@ -8,9 +8,9 @@
 namespace lumora {
 
 // The serial of a volume mixed with a random mark of the data folder, so that two data folders on one volume, and two
-// machines with one image, make different folders on the lab's server. The mark is kept in the hidden file
-// .lumora-mark together with the hardware addresses of this machine's network cards, and made anew where those are not
-// the same: an image copies all the rest. Where the mark can't be kept, the serial stays as the volume has it.
+// machines with one image, make different folders on the lab's server. The hidden file .lumora-mark keeps the mark
+// together with the hardware addresses of this machine's network cards. If the addresses differ, a new mark is made,
+// since an image copies the file but not the cards. If the mark can't be kept, the serial is that of the volume.
 class MarkedVolume : public Volume {
 public:
     MarkedVolume(const Volume& volume, HostPath dataFolder, QStringList networkCards)

@@ -6,8 +6,8 @@
 namespace lumora {
 
 // The serial of the file system on which a drive's folder lies, the same at every mount: the serial of a FAT medium,
-// else a checksum of the UUID. Where the UUID is not visible (a container, a network share), the file system's id, or
-// else its device number.
+// else a checksum of the UUID. If the UUID is not visible (a container, a network share), it is the file system's id
+// or, without one, the device number.
 class StatVolume : public Volume {
 public:
     explicit StatVolume(const Drives& drives, HostPath uuidLinks = "/dev/disk/by-uuid")

@@ -393,7 +393,7 @@ Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
         while (data.receiveBytes(rest.data(), static_cast<int>(rest.size())) > 0) {
         }
     } catch (const Poco::TimeoutException&) {
-        // It keeps the data connection open although it has all; no harm.
+        // The server keeps the data connection open although it has all bytes; that does no harm.
     } catch (const Poco::Exception&) {
         return Failure{Failure::Kind::Disconnected,
                        QStringLiteral("ftp %1: the transfer was cut at its end").arg(m_host)};

@@ -30,7 +30,7 @@ std::optional<MailEnd> endOf(EnhancedStatus status, bool forGood) {
     case 3'004: // too big for the system
         return MailEnd::TooLarge;
     default:
-        // 7: security or policy. A server that puts a stranger off for a while says so too, with a 4 in front.
+        // Subject 7 is security or policy (RFC 3463). A server that greylists an unknown client uses it too, as 4.7.x.
         if (status.subject == 7 && forGood)
             return MailEnd::AccessRefused;
         return std::nullopt;

@@ -8,7 +8,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Entries behind the first withDefault keep what they hold unless they are given.
+// Entries from withDefault on keep their value unless the file gives one.
 template <std::size_t N>
 void setSizes(std::array<QString, N>& sizes, const std::array<QString, N>& given, std::size_t withDefault) {
     for (std::size_t i = 0; i < N; ++i) {

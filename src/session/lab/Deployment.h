@@ -5,8 +5,8 @@
 
 namespace lumora {
 
-// What the installer of a lab decides, once for a machine. Each value starts as the built-in default; LabFile replaces
-// those that the lab's file gives, and LoadDefaultProfile sets the session from it.
+// The choices of a lab's installer, made once for a machine. Each value starts as the built-in default; LabFile
+// replaces those that the lab's file gives, and LoadDefaultProfile sets the session from it.
 struct Deployment {
     Deployment();
 
@@ -14,7 +14,7 @@ struct Deployment {
     // AdUrl1, AdUrl2 and PriceListUrl2 follow SiteUrl and PriceListUrl.
     ClientProfile profile;
 
-    FtpType ftpType = FtpType::Ascii; // for the line alone; dwType stays 1 under both
+    FtpType ftpType = FtpType::Ascii; // only the FTP line uses it; dwType is 1 with both
     Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;

@@ -10,15 +10,15 @@
 namespace lumora {
 
 // The form of an INI file: sections in brackets, "key = value" lines, comments from "#" or ";" at the start of a line.
-// Only the keys it is given are allowed, each once. A message names file and line, and repeats of the file no more than
-// a plain name, since a line that went wrong may hold a password.
+// Only the given keys are allowed, each once. A message names the file and the line and quotes only a plain name, since
+// a wrong line may hold a password.
 class IniReader {
 public:
     struct Key {
         QString section;
         QString name; // the file may write it in capitals or small letters
     };
-    // Takes the value of the key with this index. Gives what is wrong with the value; empty: nothing.
+    // Takes the value of the key with this index. Returns what is wrong with the value, or an empty text.
     using Taker = std::function<QString(std::size_t key, const QString& value)>;
 
     IniReader(const QString& fileName, std::vector<Key> keys)
@@ -35,7 +35,7 @@ public:
     static QString fullName(const QString& section, const QString& name) { return section + u'.' + name; }
 
 private:
-    // What is wrong with the line; empty: nothing.
+    // Returns what is wrong with the line, or an empty text.
     QString takeLine(const QString& line, const Taker& take);
     QString takeSection(const QString& line);
     QString takeValue(const QString& name, QString value, const Taker& take);

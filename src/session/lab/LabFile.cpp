@@ -11,8 +11,8 @@
 
 #include <algorithm>
 
-// The lab's file is read with Qt's own file class, since the drives that all other files are read through follow from
-// it.
+// Qt's own file class reads the lab's file: all other files are read through the drives, and the drives depend on what
+// this file says.
 
 namespace lumora {
 
@@ -29,8 +29,8 @@ bool printable(const LabKey& key, const QString& value) {
     return !control && (key.section == u"Drives" || AnsiCodePage::squeeze(value) == value);
 }
 
-// What is wrong with the value; empty: nothing, and the deployment has it. No message repeats a password or an address
-// of a mail server, nor a long text.
+// Sets the value in the deployment. Returns what is wrong with the value, or an empty text. No message repeats a
+// password or an address of a mail server, nor a long text.
 QString take(Deployment& deployment, const LabKey& key, const QString& value) {
     const QString name = IniReader::fullName(key.section, key.name);
     if (!printable(key, value))
@@ -43,7 +43,7 @@ QString take(Deployment& deployment, const LabKey& key, const QString& value) {
     return u"%1 has the wrong value \"%2\"; allowed: %3"_s.arg(name, value, key.allowed);
 }
 
-// Keys that may be empty, unless another key has been chosen without which they stand for nothing.
+// Keys that may be empty in general, but need a value when another key has a certain value.
 struct Needed {
     QString chosen; // full name of the key that needs the others
     QString as;
@@ -55,7 +55,7 @@ void checkFilled(IniReader& reader, const Needed& needed) {
     for (const auto& filled : needed.filled) {
         const auto& [name, value] = filled;
         const QString fullName = IniReader::fullName(needed.section, name);
-        if (!value.isEmpty() || !reader.errors().filter(fullName).isEmpty()) // a wrong value is told already
+        if (!value.isEmpty() || !reader.errors().filter(fullName).isEmpty()) // a wrong value has its own message
             continue;
         const auto key = std::find_if(labKeys().begin(), labKeys().end(), [&](const LabKey& known) {
             return known.section == needed.section && known.name == filled.first;

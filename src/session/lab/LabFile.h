@@ -14,8 +14,9 @@
 // packaging/lab.ini.example explains each key.
 namespace lumora {
 
-// A deployment read, and what is to be told about it. With errors the deployment must not be used: a lab would work
-// with values that nobody chose. Each text names file, line and key, and what is allowed; no text holds a password.
+// The deployment as it was read, and the errors and warnings about it. With errors the deployment must not be used: a
+// lab would work with values that nobody chose. Each text names file, line and key, and what is allowed; no text holds
+// a password.
 struct LabFileReading {
     Deployment deployment;
     QStringList errors;
@@ -25,7 +26,7 @@ struct LabFileReading {
 // fileName is for the messages only.
 LabFileReading ParseLabFile(const QByteArray& bytes, const QString& fileName);
 
-// A file that can't be read is an error; one that holds a password and that others may read draws a warning.
+// A file that can't be read is an error; one that holds a password and that others may read gives a warning.
 LabFileReading ReadLabFile(const HostPath& file);
 
 // lab.ini beside the program, in /etc/lumora, in $XDG_CONFIG_HOME/lumora (or ~/.config/lumora): in this order.

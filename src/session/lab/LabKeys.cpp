@@ -164,7 +164,7 @@ struct Row {
 };
 
 std::vector<Row> rows() {
-    // "^" parts the pieces of the settings text.
+    // "^" separates the pieces of the settings text.
     return {
         {"Server", "Host", host(&P::FtpServer)},
         {"Server", "User", text(at(&P::FtpUser), u"1 to 80 characters, not ^"_s, u"[^^]{1,80}"_s)},

@@ -11,8 +11,8 @@ namespace lumora {
 struct LabKey {
     QString section;
     QString name;
-    QString allowed; // the values that the key takes, as a message says it
-    // False for a value that is not allowed; the deployment stays as it was then.
+    QString allowed; // the values that the key takes, in the words of a message
+    // Returns false for a value that is not allowed; the deployment is unchanged then.
     std::function<bool(Deployment&, const QString&)> set;
 };
 

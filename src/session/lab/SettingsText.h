@@ -24,8 +24,8 @@ struct SettingsPieces {
 };
 SettingsPieces SplitSettings(const QString& text);
 
-// A second kind of such a text carries one field of a customer's prepaid card: the field's name as the first piece and
-// its value as the second. The record it belongs to is not kept by any page yet.
+// A second kind of settings text has one field of a customer's prepaid card: the field's name is the first piece and
+// its value the second. No page keeps the record of these fields yet.
 struct OrderCardEntry {
     QString field;
     QString value;
