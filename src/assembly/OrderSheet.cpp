@@ -146,7 +146,7 @@ QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
         plainTopLine(state, now),
         u"  ShemZalam...."_s + album.ShemZalam + u"        TelZalam....."_s + album.TelZalam + u"      "_s +
             state.shemot.n4,
-        // No line break behind the event: the address goes on beside it.
+        // The address stands on the line of the event.
         u"  ShemErooa...."_s + album.ShemErooa + u"    "_s + state.shemot.n3 + u"      "_s,
         u"  MailZalam...."_s + album.MailZalam,
         u"  Total pictures..."_s + QString::number(state.shemot.TotalPics),

@@ -75,8 +75,7 @@ protected:
     void sheetDrawn(const Bitmap& sheet) override;
     bool yield() override;
 
-    // The order is whole: the page flow has the page that goes on with it, and this one is left. A local station keeps
-    // its orders.
+    // The order is whole. Follows the page flow to the sender; a local station keeps its orders.
     void handOver(Outcome toSender);
     bool handedOver() const { return m_handedOver; }
     void leaveProgram();

@@ -38,9 +38,8 @@ public:
         // Set where a file of the order could not be written: a picture that can't be read is its own fault.
         std::optional<Failure> writeFailure;
     };
-    // The scratch picture of the step before goes, picture() is made and becomes the scratch picture, and its print
-    // file is written. Where nothing could be made there is no scratch picture either, so that no picture is ever
-    // printed as the one before it.
+    // Removes the scratch picture of the step before, makes a new one by picture() and writes its print file. If
+    // picture() fails there is no scratch picture, so that no picture is printed as the one before it.
     Outcome pack(const Line& line, const std::function<Result<QByteArray>()>& picture);
 
     // Takes the scratch picture away.

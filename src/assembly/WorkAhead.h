@@ -54,7 +54,7 @@ private:
         try {
             return std::async(std::launch::async, work);
         } catch (const std::system_error&) {
-            // No thread to be had: the work is done when it is taken.
+            // No thread could be started: the work is done when its result is taken.
             return std::async(std::launch::deferred, std::move(work));
         }
     }

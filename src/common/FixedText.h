@@ -34,7 +34,7 @@ QString ZeroPadded(long long number, int width);
 // A number as plain decimal text with at most seven significant digits, never with an exponent, no trailing zeros.
 QString PlainNumber(float number);
 
-// True if the text holds a "?": what a character outside the code page has become.
+// True if the text holds a "?", which replaces a character outside the code page.
 bool HasQuestionMark(const QString& text);
 
 // Two upper-case hexadecimal digits for each character, taken by its value in the ANSI code page.

@@ -41,7 +41,7 @@ Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t 
 // The next read begins behind the first offset bytes.
 Result<void> skipTo(const Descriptor& source, qint64 offset, const QString& path);
 
-// The whole file; one larger than that many bytes is a failure. path is for the message.
+// Reads the whole file; more than largest bytes is a failure. path appears in the message.
 Result<QByteArray> readWholeFile(const std::filesystem::path& host, const QString& path, qint64 largest);
 
 // The new content of a file, beside it under a hidden name until it is whole: a crash or a full disk leaves the old
@@ -70,8 +70,8 @@ private:
 };
 
 inline constexpr qint64 toTheEnd = std::numeric_limits<qint64>::max();
-// Takes away what ended programs have left of files they were writing, in this folder and all below it; links are not
-// followed. Only what is older than the given time, and how many there were. No program may be at work in the folder.
+// Removes hidden temporary files that ended programs left in this folder and below, if they are older than before;
+// links are not followed. Returns their number. No program may be writing in the folder.
 int removeLeftovers(const std::filesystem::path& folder, std::filesystem::file_time_type before);
 
 // Appends the next bytes of the source, up to count of them, and tells how many there were. Stops early when the target

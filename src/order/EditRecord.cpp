@@ -105,8 +105,8 @@ QString columnOf(const QString& record, R::Column column) {
 void UnpackEditState(const QString& record, EditFields& fields) {
     fields.EditState = LeftField(record, R::width);
     const auto text = [&](R::Column column) { return columnOf(fields.EditState, column); };
-    // A picture stays without an edit whose field of the record has letters in place of a number: 0 would print it
-    // black or shrunk to nothing.
+    // If a field has letters where a number belongs, the picture prints without that edit: a 0 would print it black or
+    // shrunk to nothing.
     const auto isDamaged = [&](R::Column column) {
         const QString field = text(column).trimmed();
         return !field.isEmpty() && !beginsWithNumber(field);

@@ -92,7 +92,7 @@ struct FromText {
 } // namespace
 
 QList<ListOutputEntry> ChoicesOf(const SessionState& state) {
-    SessionState copy = state; // the fields lead to a session that may be changed
+    SessionState copy = state; // choicesIn() needs a session that is not const
     QList<ListOutputEntry> choices;
     for (const Choice& choice : choicesIn(copy))
         choices += {choice.key, std::visit(AsText{}, choice.field)};

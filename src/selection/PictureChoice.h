@@ -25,7 +25,7 @@ public:
     const TextList& page() const { return m_page; }
     // Empty for a cell without a picture.
     QString path(int cell) const { return m_page.item(cell); }
-    // What the cell shows, 0 to 99: of two cells with the same picture each has its own number.
+    // The number that the cell shows, 0 to 99. Two cells with the same picture count separately.
     int copies(int cell) const { return m_copies.at(static_cast<std::size_t>(cell)); }
     bool chosen(int cell) const { return copies(cell) > 0; }
     bool inBasket(const QString& path) const { return m_basket.FindByPath(path) >= 0; }

@@ -50,7 +50,7 @@ private:
     const Files& m_files;
     const std::optional<PaperSize> m_paper;
     std::vector<BasketLine> m_items;
-    std::unique_ptr<Ahead> m_ahead; // last, so that it ends first
+    std::unique_ptr<Ahead> m_ahead; // declared last, since its function reads the members above
 };
 
 } // namespace lumora

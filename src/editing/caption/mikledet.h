@@ -14,7 +14,8 @@ struct Platform;
 struct SessionState;
 class PageChain;
 
-// The on-screen keyboard: the customer writes a picture's caption on it, below the editor's picture.
+// mikledet, "on-screen keyboard" in the glossary: the customer writes a picture's caption on it, below the editor's
+// picture.
 //
 // The page changes the caption's fields of the edit state, and the editor takes them after each change, so that the
 // picture and the list follow at once. Positions of the caption are in pixels of the preview.

@@ -31,7 +31,8 @@ struct BigPicsControls : Controls {
     AutoLevels levels;
 };
 
-// The editor's work picture: the editor draws its previews from it and measures it; nobody sees the page.
+// BigPics, "the editor's work picture" in the glossary: a page without a view, from which the editor draws its previews
+// and by which it measures the picture.
 class BigPics : public Page, private BigPicsControls {
     Q_OBJECT
 public:

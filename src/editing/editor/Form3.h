@@ -22,7 +22,8 @@ struct Form3Controls : Controls {
     Caption unreadable{*this, u"unreadable", Caption::At::Hidden}; // stands in place of a picture that can't be read
 };
 
-// A picture turned: the customer looks at one picture of the page of pictures, large. Nothing of it is kept.
+// Form3, "a picture turned, to look at" in the glossary: the customer looks at one picture of the page of pictures,
+// large. Nothing of it is kept.
 class Form3 : public Page, private Form3Controls {
     Q_OBJECT
 public:

@@ -27,8 +27,8 @@ struct gdisaveControls : Controls {
         Command6{*this, u"Command6"}, Command7{*this, u"Command7"}, cmdSaveAsJpg{*this, u"cmdSaveAsJpg"};
 };
 
-// The saver: the preparation and sending pages save their pictures as JPEG files by it. The page is never shown and
-// stays loaded until the program ends. It saves nothing unless GdiReady is set.
+// gdisave, "saves pictures" in the glossary: a page without a view, by which the preparation and sending pages save
+// their pictures as JPEG files. It stays loaded until the program ends and saves nothing unless GdiReady is set.
 class gdisave : public Page, private gdisaveControls {
     Q_OBJECT
 public:

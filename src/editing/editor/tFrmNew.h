@@ -25,7 +25,8 @@ struct EditFields;
 struct Platform;
 struct SessionState;
 
-// The editor: the customer changes how one picture will be printed, its zoom, place, turn, colour, frame and caption.
+// tFrmNew, "the editor" in the glossary: the customer changes how one picture will be printed, its zoom, place, turn,
+// colour, frame and caption.
 //
 // Each change goes into the edit fields of the session, which are packed into the record and handed to the page of
 // pictures at once, so that leaving needs no saving. The controls differ on purpose in when they pack, draw and store.

@@ -18,7 +18,8 @@ struct Platform;
 struct SessionState;
 class PageChain;
 
-// Red-eye correction: the customer places a circle on each red pupil and has the red taken out of it.
+// RedI, "red-eye correction" in the glossary: the customer places a circle on each red pupil and has the red taken out
+// of it.
 //
 // The corrected picture goes to a file of its own, which the editor and the print use from then on; the customer's file
 // is opened for reading only, and each visit starts from it again.

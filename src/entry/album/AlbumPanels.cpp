@@ -9,7 +9,7 @@
 
 #include <algorithm>
 
-// What the photographer does on the panels. AlbumPanelsTexts.cpp has what they say and show.
+// The photographer's events; the texts of the panels stand in AlbumPanelsTexts.cpp.
 
 namespace lumora {
 
@@ -189,7 +189,7 @@ void AlbumPanels::leaveKind() {
 
 // --- size, cover, paper, extras ---
 
-// A list that is filled keeps what was taken when its panel is passed again.
+// A list is filled once, so that the choice stays when its panel opens again.
 void AlbumPanels::goOnTo(Panel next) {
     for (const ListRow& row : listTable()) {
         if (row.panel == next && row.list.rows.isEmpty())

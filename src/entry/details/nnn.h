@@ -12,8 +12,8 @@ namespace lumora {
 class PageChain;
 struct SessionState;
 
-// The details of the order: here the customer takes the kind of order from a menu and then, step by step, gives name,
-// paper, border and fit and agrees to the terms, up to the choice of pictures.
+// nnn, "details of the order" in the glossary: the customer takes the kind of order from a menu and then, step by step,
+// gives name, paper, border and fit and agrees to the terms, up to the choice of pictures.
 class nnn : public Page, private nnnControls {
     Q_OBJECT
 public:

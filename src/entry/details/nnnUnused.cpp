@@ -1,10 +1,9 @@
+// Called by nothing: the quick order by a name alone and the orders by a coupon, to which no control leads yet.
 #include "entry/details/nnn.h"
 
 #include "entry/details/DetailStore.h"
 #include "entry/details/TileMenu.h"
 #include "session/SessionState.h"
-
-// Called by nothing: the quick order by a name alone and the orders by a coupon, to which no control leads yet.
 
 namespace lumora {
 

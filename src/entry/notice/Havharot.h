@@ -18,8 +18,8 @@ struct HavharotControls : Controls {
     Caption Command4{*this, u"Command4"};
 };
 
-// Clarifications and warnings: a notice that the customer opens from the menu of the details page, reads, and leaves
-// for that page again.
+// Havharot, "clarifications and warnings" in the glossary: the customer opens a notice from the menu of the details
+// page, reads it, and returns to that page.
 class Havharot : public Page, private HavharotControls {
     Q_OBJECT
 public:

@@ -82,9 +82,8 @@ struct MoogMeretControls : Controls {
     Caption Command19{*this, u"Command19"}; // stop the walk
 };
 
-// The page of finished orders (MoogMeret, "finished"): the customer picks an order prepared earlier and its files, and
-// sends them again by the order's sender, or by mail in packages, one every few minutes. The order's folder never
-// changes.
+// MoogMeret, "finished" in the glossary: the customer picks an order prepared earlier and its files, and sends them
+// again by the order's sender, or by mail in packages, one every few minutes. The order's folder never changes.
 class MoogMeret : public Page, private MoogMeretControls {
     Q_OBJECT
 public:

@@ -19,7 +19,8 @@ struct Platform;
 struct SessionState;
 class tFrmNew;
 
-// The page of pictures: the customer finds the pictures of an order, chooses and counts them, and sends them on.
+// kyoskNew, "choosing the pictures" in the glossary: the customer finds the pictures of an order, chooses and counts
+// them, and sends them on.
 //
 // Clicks may arrive while the small pictures are drawn: a redraw that a later one overtook stops at once.
 class kyoskNew : public Page, private kyoskNewControls {

@@ -21,7 +21,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 namespace {
-// Drawn between two pumps: as many as a small machine has cores.
+// Small pictures drawn between two pumps: one for each core of a small machine.
 constexpr int drawnAtOnce = 2;
 } // namespace
 

@@ -34,7 +34,7 @@ void kyoskNew::checkAndClose() {
         plain() ? deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa) : DeepCompression::Off;
     m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
     openClosingPanel();
-    // The question lies over the closing panel, and so comes behind it.
+    // The question is shown only together with the closing panel below it.
     Picture7.visible = PicB4Sioom.visible && deep == DeepCompression::Ask;
 }
 
@@ -85,7 +85,7 @@ void kyoskNew::setDeepCompression(bool deep) {
     Q_EMIT changed();
 }
 
-// The panel lies over the closing panel: a view hears of it when both are open.
+// Does not signal: the caller signals once for both panels.
 void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)

@@ -33,7 +33,7 @@ QWidget* MoogMeretView::makeOrders() {
     return card.frame;
 }
 
-// What stands in the place of the files until there are any to show.
+// Stands in place of the files until an order is picked.
 QWidget* MoogMeretView::makeHint() {
     m_hint =
         inBox(inColumn(Space::Normal, {Item::room(),

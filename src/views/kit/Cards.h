@@ -72,7 +72,7 @@ private:
     QColor m_ribbon;
 };
 
-// A border around the sample picture, by the border's code, large.
+// The sample picture, large, with the border of the given code.
 class BorderSample : public QWidget {
     Q_OBJECT
 public:

@@ -11,7 +11,7 @@ QRectF fitted(const QRectF& place, QSizeF shape, double share = 1);
 void drawImage(QPainter& painter, const QRectF& place, const QImage& image);
 void drawIcon(QPainter& painter, QPointF centre, const QPixmap& icon);
 
-// A box with rounded corners within the rectangle; what it returns is the middle of its line.
+// Draws a box with rounded corners inside the rectangle; returns the rectangle along the middle of its outline.
 QRectF drawCard(QPainter& painter, const QRect& place, QColor edge, QColor fill, double thick, double corner);
 
 // The round sign in the upper corner of a card where the reading direction ends.

@@ -17,7 +17,7 @@ public:
 
     void setInk(QColor colour);
     void setPicture(const QImage& picture);
-    // The customer has this one at present.
+    // marked: the tool's setting is the one in use.
     void setMarked(bool marked);
 
     QSize sizeHint() const override;

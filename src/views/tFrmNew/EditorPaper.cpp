@@ -145,7 +145,7 @@ void EditorPaper::mouseReleaseEvent(QMouseEvent* event) {
     drag(QEvent::MouseButtonRelease, onPaper(event->position()));
 }
 
-// The pointer is lost with the widget that holds it.
+// A hidden widget gets no release, so the drag ends here.
 void EditorPaper::hideEvent(QHideEvent* event) {
     if (m_drag != Drag::None)
         drag(QEvent::MouseButtonRelease, {});

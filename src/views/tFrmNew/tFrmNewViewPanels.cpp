@@ -120,7 +120,7 @@ void tFrmNewView::makeTurnPanel() {
     bind(m_turnPanel, c.Frame4);
 }
 
-// What doubles another control or shows the customer nothing is for the operator.
+// The operator's panel: controls that double another one or show the customer nothing.
 void tFrmNewView::makeOperatorPanel() {
     const Card panel = makeCard("notice", Pad::Tight);
     m_operatorPanel = panel.frame;

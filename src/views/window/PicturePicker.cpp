@@ -107,8 +107,7 @@ bool isJpeg(const HostPath& path) {
     return toText(path.extension()).compare(u".jpg", Qt::CaseInsensitive) == 0;
 }
 
-// A picture whose last folder is remembered for the next pick of the same run would be another customer's business: the
-// picker opens at the first place that holds anything.
+// The picker opens at the first place that holds anything, not at the last folder: that may be another customer's.
 bool holdsAnything(const HostPath& folder) {
     std::error_code error;
     std::filesystem::directory_iterator at(folder, std::filesystem::directory_options::skip_permission_denied, error);
