@@ -156,8 +156,8 @@ QWidget* mikledetView::makeKeys() {
     letters(c.Command4, c.words.hebrewLetters, &mikledet::Command4_Click, 0);
     letters(c.Command9, c.words.smallLetters, &mikledet::Command9_Click, 1);
     letters(c.Command2, c.words.capitalLetters, &mikledet::Command2_Click, 2);
-    const auto wordKey = [&](const Caption& caption, void (mikledet::*clicked)(), int column, int columns) {
-        grid->addWidget(toKey(button(caption, Role::Quiet, clicked)), 3, column, 1, columns);
+    const auto wordKey = [&](const Caption& caption, void (mikledet::*clicked)(), int column, int width) {
+        grid->addWidget(toKey(button(caption, Role::Quiet, clicked)), 3, column, 1, width);
     };
     wordKey(c.Command5, &mikledet::Command5_Click, 3, 1);
     wordKey(c.Command1, &mikledet::Command1_Click, 4, 4);
