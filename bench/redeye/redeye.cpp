@@ -63,7 +63,7 @@ int main(int argc, char** argv) {
     }
 
     auto& page = chain.load<RedI>();
-    const Times opening = timed([&] { page.open(QStringLiteral("C:\\large.jpg")); });
+    const Times opening = timed([&] { page.open(DrivePath(QStringLiteral("C:\\large.jpg"))); });
     if (page.picture().Picture1.isNull())
         return 1;
     std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", opening.wall, opening.processor);
