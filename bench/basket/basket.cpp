@@ -6,17 +6,19 @@
 
 #include <benchmark/benchmark.h>
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 using namespace lumora;
 
 constexpr int pictures = 5000;
-const DrivePath folder(QStringLiteral("E:\\DCIM\\100CAMERA\\חופשה בצפון"));
+const DrivePath folder(u"E:\\DCIM\\100CAMERA\\חופשה בצפון"_s);
 
 QStringList names() {
     QStringList list;
     for (int i = 0; i < pictures; ++i)
-        list += QStringLiteral("IMG_%1.jpg").arg(i, 5, 10, QLatin1Char('0'));
+        list += u"IMG_%1.jpg"_s.arg(i, 5, 10, QLatin1Char('0'));
     return list;
 }
 
@@ -27,8 +29,7 @@ FolderPager foundPictures() {
 }
 
 QString line(int copies, const QString& path, LineForm form) {
-    return BasketLine{PrintCode{copies, QStringLiteral("1015"), u'G', QStringLiteral("NB")}.compose(),
-                      EditRecord::newPicture(), DrivePath(path)}
+    return BasketLine{PrintCode{copies, u"1015"_s, u'G', u"NB"_s}.compose(), EditRecord::newPicture(), DrivePath(path)}
         .compose(form);
 }
 

@@ -2,10 +2,12 @@
 #include <QDir>
 #include <QImage>
 
+using namespace Qt::StringLiterals;
+
 int main(int argc, char** argv) {
     if (argc != 2)
         return 2;
-    const QString folder = QString::fromLocal8Bit(argv[1]) + QStringLiteral("/bench/");
+    const QString folder = QString::fromLocal8Bit(argv[1]) + u"/bench/"_s;
     QImage frame(900, 600, QImage::Format_RGB32);
     frame.fill(Qt::black);
     QImage clear(frame.size(), QImage::Format_ARGB32);
@@ -19,8 +21,8 @@ int main(int argc, char** argv) {
             }
         }
     }
-    return QDir().mkpath(folder) && frame.save(folder + QStringLiteral("f.bmp")) &&
-                   frame.save(folder + QStringLiteral("kf.bmp")) && clear.save(folder + QStringLiteral("f.png"))
+    return QDir().mkpath(folder) && frame.save(folder + u"f.bmp"_s) && frame.save(folder + u"kf.bmp"_s) &&
+                   clear.save(folder + u"f.png"_s)
                ? 0
                : 1;
 }

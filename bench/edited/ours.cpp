@@ -10,6 +10,8 @@
 
 #include <QGuiApplication>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -25,11 +27,11 @@ EditFields recordOf(const Job& job) {
         return edit;
     edit.GainR = Job::red;
     edit.GainB = Job::blue;
-    edit.FrameFolder = QStringLiteral("bench");
-    edit.FrameName = QStringLiteral("f");
+    edit.FrameFolder = u"bench"_s;
+    edit.FrameName = u"f"_s;
     edit.TextOn = 1;
     edit.TextBody = QString::fromLatin1(Job::caption);
-    edit.TextFont = QStringLiteral("DejaVu Sans");
+    edit.TextFont = u"DejaVu Sans"_s;
     edit.TextFontSize = 24;
     edit.TextX = 32;
     edit.TextY = 230;

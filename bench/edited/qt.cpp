@@ -7,6 +7,8 @@
 
 #include <algorithm>
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 void tone(QImage& picture) {
@@ -59,7 +61,7 @@ int main(int argc, char** argv) {
             const QImage frame = keyed(QImage(QString::fromStdString((job.frames / "f.bmp").string())));
             painter.drawImage(
                 0, 0, frame.scaled(Job::paperWidth, Job::paperHeight, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
-            QFont font(QStringLiteral("DejaVu Sans"));
+            QFont font(u"DejaVu Sans"_s);
             font.setPixelSize(Job::captionSize);
             painter.setFont(font);
             painter.setPen(QColor(40, 40, 40, 180));

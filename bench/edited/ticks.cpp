@@ -13,6 +13,8 @@
 #include <cstdio>
 #include <functional>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -35,11 +37,11 @@ int main(int argc, char** argv) {
 
     EditFields edit;
     UnpackEditState(EditRecord::newPicture(), edit);
-    edit.FrameFolder = QStringLiteral("bench");
-    edit.FrameName = QStringLiteral("f");
+    edit.FrameFolder = u"bench"_s;
+    edit.FrameName = u"f"_s;
     edit.TextOn = 1;
-    edit.TextBody = QStringLiteral("שלום Lumora 2024\r\nמזל טוב");
-    edit.TextFont = QStringLiteral("DejaVu Sans");
+    edit.TextBody = u"שלום Lumora 2024\r\nמזל טוב"_s;
+    edit.TextFont = u"DejaVu Sans"_s;
     edit.TextFontSize = 24;
     edit.TextX = 40;
     edit.TextY = 60;

@@ -24,6 +24,8 @@
 #include <algorithm>
 #include <cstdio>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -38,7 +40,7 @@ public:
 
 // A field of /proc/self/status in MiB: "VmRSS:", what the process holds now; "VmHWM:", the most it ever held.
 double memory(const char* field) {
-    QFile file(QStringLiteral("/proc/self/status"));
+    QFile file(u"/proc/self/status"_s);
     if (!file.open(QIODevice::ReadOnly))
         return -1;
     for (const QByteArray& line : file.readAll().split('\n')) {
@@ -106,9 +108,9 @@ public:
         m_state.Optint = kind == Kind::Plain ? OrderKind::Print : OrderKind::EditedPrint;
         m_state.profile.JppBase = 30;
         m_state.profile.JppChunks = 56;
-        m_state.shemot.ppr = QStringLiteral("10/15");
-        m_state.shemot.TimeOfJob = QStringLiteral("2026_11_21_KUP_1234^");
-        m_state.shemot.ser = QStringLiteral("1234");
+        m_state.shemot.ppr = u"10/15"_s;
+        m_state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+        m_state.shemot.ser = u"1234"_s;
         for (const PageId id : {PageId::hatchala, PageId::FtpFrm})
             m_chain.registerPage(id, [id] { return std::make_unique<OtherPage>(id); });
         m_chain.registerPage(PageId::Form2, [this] { return std::make_unique<Form2>(m_state, m_platform, m_chain); });
@@ -124,7 +126,7 @@ public:
         m_state.MisparHazmana = QString::number(++m_number);
         for (int i = 0; i < pictures; ++i)
             m_state.handOver.lines +=
-                QStringLiteral("1 1015GNB") + (m_kind == Kind::Edited ? recordOf(i) : QString()) + drivePath(i).text();
+                u"1 1015GNB"_s + (m_kind == Kind::Edited ? recordOf(i) : QString()) + drivePath(i).text();
         const PageId id = m_kind == Kind::Plain ? PageId::Form2 : PageId::B3;
         m_chain.show(id);
         auto* page = dynamic_cast<PreparationPage*>(m_chain.find(id));
@@ -136,7 +138,7 @@ public:
             else if (auto* edited = dynamic_cast<B3*>(page))
                 edited->Command5_Click();
         });
-        const auto made = m_machine.files.names(m_state.transfer.OrderFolder, QStringLiteral("*.jpp")).size() - 1;
+        const auto made = m_machine.files.names(m_state.transfer.OrderFolder, u"*.jpp"_s).size() - 1;
         if (made != pictures || m_chain.front()->id() != PageId::FtpFrm) {
             std::fprintf(stderr, "the order is not whole: %lld of %d prints\n%s\n", static_cast<long long>(made),
                          pictures, qPrintable(m_machine.dialogs.messages.join(u'\n')));
@@ -196,7 +198,7 @@ private:
         EditedPrint print;
         print.file = edit.RedMarker == EditRecord::corrected ? corrected(i) : source(i);
         print.paper = {10, 15};
-        print.framesFolder = *m_machine.drives.toHost(DrivePath(QStringLiteral("C:\\2000lumora\\misgarot")));
+        print.framesFolder = *m_machine.drives.toHost(DrivePath(u"C:\\2000lumora\\misgarot"_s));
         return renderEditedPrintToJpeg(print, edit);
     }
 
@@ -239,7 +241,7 @@ int peakMemory(Kind kind, int pictures) {
     std::printf("before the order %.0f MiB (most so far, with the making of the pictures: %.0f)\n", memory("VmRSS:"),
                 memory("VmHWM:"));
     // The most so far starts anew.
-    QFile clear(QStringLiteral("/proc/self/clear_refs"));
+    QFile clear(u"/proc/self/clear_refs"_s);
     if (!clear.open(QIODevice::WriteOnly) || clear.write("5") != 1)
         std::printf("the mark of the most could not be reset\n");
     clear.close();
@@ -261,12 +263,11 @@ int main(int argc, char** argv) {
     keepPictureMemory();
     QGuiApplication application(argc, argv);
     QStringList arguments = QCoreApplication::arguments();
-    const Kind kind = arguments.removeAll(QStringLiteral("edited")) > 0 ? Kind::Edited : Kind::Plain;
+    const Kind kind = arguments.removeAll(u"edited"_s) > 0 ? Kind::Edited : Kind::Plain;
     if (arguments.value(1) == QLatin1String("ratio"))
-        return ratio(kind, arguments.value(2, QStringLiteral("100")).toInt(),
-                     arguments.value(3, QStringLiteral("3")).toInt());
+        return ratio(kind, arguments.value(2, u"100"_s).toInt(), arguments.value(3, u"3"_s).toInt());
     if (arguments.value(1) == QLatin1String("memory"))
-        return peakMemory(kind, arguments.value(2, QStringLiteral("300")).toInt());
+        return peakMemory(kind, arguments.value(2, u"300"_s).toInt());
     std::fprintf(stderr, "bench_order ratio|memory [PICTURES] [ROUNDS] [edited]\n");
     return 2;
 }

@@ -20,6 +20,8 @@
 #include <thread>
 #include <vector>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -63,7 +65,7 @@ int main(int argc, char** argv) {
     }
 
     auto& page = chain.load<RedI>();
-    const Times opening = timed([&] { page.open(DrivePath(QStringLiteral("C:\\large.jpg"))); });
+    const Times opening = timed([&] { page.open(DrivePath(u"C:\\large.jpg"_s)); });
     if (page.picture().Picture1.isNull())
         return 1;
     std::printf("opening 50 megapixels: %.0f ms, processor %.0f ms\n", opening.wall, opening.processor);

@@ -13,6 +13,9 @@
 #include <cstdint>
 
 namespace lumora::demo {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr double w = sheetWidth;
@@ -179,8 +182,8 @@ void filmStrip(QPainter& painter) {
     painter.setPen(QColor(242, 169, 59));
     for (int i = 0; i < 4; ++i) {
         const double x = 120 + i * w / 4;
-        painter.drawText(QPointF(x, 28), QStringLiteral("LUMORA 400"));
-        painter.drawText(QPointF(x, h - 12), QStringLiteral("%1     %1A").arg(24 + i));
+        painter.drawText(QPointF(x, 28), u"LUMORA 400"_s);
+        painter.drawText(QPointF(x, h - 12), u"%1     %1A"_s.arg(24 + i));
     }
 }
 

@@ -10,6 +10,8 @@
 
 #include <cstdio>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -69,9 +71,8 @@ int main(int argc, char** argv) {
             const QImage frame = demo::asFrameFile(art);
             // Each pixel of the preview's frame is one of the print's: a mixture would give the art a dark rim.
             const QImage small = frame.scaled(previewSize, Qt::IgnoreAspectRatio, Qt::FastTransformation);
-            if (!save(frame, inside + name + QStringLiteral(".bmp")) ||
-                !save(small, inside + u'k' + name + QStringLiteral(".bmp")) ||
-                !save(listPicture(frame), inside + name + QStringLiteral(".png")))
+            if (!save(frame, inside + name + u".bmp"_s) || !save(small, inside + u'k' + name + u".bmp"_s) ||
+                !save(listPicture(frame), inside + name + u".png"_s))
                 return 1;
         }
     }

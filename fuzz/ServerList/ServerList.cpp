@@ -5,13 +5,15 @@
 #include <cstdint>
 #include <cstdlib>
 
+using namespace Qt::StringLiterals;
+
 // The list that a web server gives of an order's folder. Whatever it says, what is missing is part of the order, and no
 // entry takes more than one file off it.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     using namespace lumora;
-    const QString folder = QStringLiteral("2026_11_21_KUP_1234^105");
-    const QStringList files = {QStringLiteral("C:\\o\\2026_11_21_KUP_1234^105.txt"), QStringLiteral("C:\\o\\!105.jpg"),
-                               QStringLiteral("C:\\o\\021015GNB0000_03AABB.jpp"), QStringLiteral("C:\\o\\1.jpp")};
+    const QString folder = u"2026_11_21_KUP_1234^105"_s;
+    const QStringList files = {u"C:\\o\\2026_11_21_KUP_1234^105.txt"_s, u"C:\\o\\!105.jpg"_s,
+                               u"C:\\o\\021015GNB0000_03AABB.jpp"_s, u"C:\\o\\1.jpp"_s};
     const QByteArray bytes(reinterpret_cast<const char*>(data), static_cast<qsizetype>(size));
     const ServerAnswer answer = ReadServerAnswer(AnsiCodePage::decode(bytes), folder);
     const QStringList missing = MarkHossarim(files, answer.entries, folder);
@@ -19,7 +21,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     for (const QString& file : missing)
         holds = holds && files.contains(file);
     for (const QString& entry : answer.entries)
-        holds = holds && !entry.trimmed().isEmpty() && !entry.contains(QStringLiteral("~~"));
+        holds = holds && !entry.trimmed().isEmpty() && !entry.contains(u"~~"_s);
     if (answer.verdict == ServerVerdict::Listed)
         holds = holds && answer.namesFolder && answer.entries.size() >= 2;
     if (!holds)

@@ -127,10 +127,9 @@ Result<void> Program::start() {
     Instances run(dataFolder, reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared);
     if (run.refused()) {
         m_otherCameForward = CallForward(dataFolder);
-        return Failure{
-            Failure::Kind::InUse,
-            QStringLiteral("%1: the program is already running with this data folder; only one may at a time")
-                .arg(toText(dataFolder))};
+        return Failure{Failure::Kind::InUse,
+                       u"%1: the program is already running with this data folder; only one may at a time"_s.arg(
+                           toText(dataFolder))};
     }
     if (!run.another())
         removeLeftovers(dataFolder, startTime);

@@ -4,12 +4,15 @@
 #include <QSet>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 using Lengths = QHash<QString, std::optional<qint64>>;
 
 // Every order of the workspace sends its own content under this name.
-const QString sharedName = QStringLiteral("000.jpg");
+const QString sharedName = u"000.jpg"_s;
 
 void add(Lengths& lengths, const QString& name, std::optional<qint64> length) {
     std::optional<qint64>& kept = lengths[name];

@@ -10,14 +10,16 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace EditRecord {
 
 QString newPicture() {
-    return LeftField(QStringLiteral("1   1   1   180100999 999 000000000000000000"), width);
+    return LeftField(u"1   1   1   180100999 999 000000000000000000"_s, width);
 }
 
 QString beforeAnyPicture() {
-    return LeftField(QStringLiteral("1   1   1   "), width);
+    return LeftField(u"1   1   1   "_s, width);
 }
 
 std::int16_t stored(Column column, std::int16_t number) {
@@ -36,9 +38,9 @@ QString stored(Column column, const QString& text) {
 }
 
 QString frameOfBorder(const QString& paperBorderCode) {
-    if (paperBorderCode == QStringLiteral("WB"))
-        return QStringLiteral("001");
-    return paperBorderCode == QStringLiteral("BK") ? QStringLiteral("002") : noFrame;
+    if (paperBorderCode == u"WB"_s)
+        return u"001"_s;
+    return paperBorderCode == u"BK"_s ? u"002"_s : noFrame;
 }
 
 } // namespace EditRecord
@@ -92,7 +94,7 @@ constexpr R::Column carriedColumns[] = {R::Spare59, R::Spare61, R::Spare90};
 
 // True when the field has a digit behind at most a sign, blanks and a point.
 bool beginsWithNumber(const QString& field) {
-    static const QRegularExpression number(QStringLiteral("^[+-]? *\\.?[0-9]"));
+    static const QRegularExpression number(u"^[+-]? *\\.?[0-9]"_s);
     return number.match(field).hasMatch();
 }
 
@@ -143,7 +145,7 @@ void PackEditState(EditFields& fields, const QString& paperBorderCode, const QSt
         text(column, fields.*field);
     for (const R::Column column : carriedColumns)
         text(column, QString::number(Val16(columnOf(before, column))));
-    text(R::Tag, QStringLiteral("ddd"));
+    text(R::Tag, u"ddd"_s);
     text(R::TextBody, fields.TextBody);
     fields.EditState = record;
 }

@@ -16,6 +16,8 @@
 #include <optional>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 namespace {
 
@@ -54,7 +56,7 @@ public:
         m_report.items = static_cast<int>(m_log.items.size());
         m_report.failed = static_cast<int>(m_log.failed.size());
         if (folderName != m_log.Hazmana && folderName != m_log.Hazmana + u'P')
-            fault(QStringLiteral("the log is that of order \"%1\"").arg(m_log.Hazmana));
+            fault(u"the log is that of order \"%1\""_s.arg(m_log.Hazmana));
         checkTotals();
         checkSheet();
         for (const QString& name : namesWith(m_folder, ".jpp")) {
@@ -71,13 +73,10 @@ private:
     void checkTotals() {
         m_report.copies = sumOfCopies(m_log.items, CopiesIn::BasketLines);
         if (m_report.copies != m_log.shemot.TotalPics)
-            fault(QStringLiteral("the log's total is %1, its lines add up to %2")
-                      .arg(m_log.shemot.TotalPics)
-                      .arg(m_report.copies));
+            fault(u"the log's total is %1, its lines add up to %2"_s.arg(m_log.shemot.TotalPics).arg(m_report.copies));
         if (m_log.countOfFailed && *m_log.countOfFailed != m_log.failed.size())
-            fault(QStringLiteral("the log counts %1 failed pictures and names %2")
-                      .arg(*m_log.countOfFailed)
-                      .arg(m_log.failed.size()));
+            fault(
+                u"the log counts %1 failed pictures and names %2"_s.arg(*m_log.countOfFailed).arg(m_log.failed.size()));
     }
 
     // The sheet of an edited order may end in .jpg, instead of .jpp or besides it.
@@ -85,8 +84,8 @@ private:
         const auto named = [this](const QString& ending) {
             return SheetName(m_tail.orderNumber, m_tail.serial, ending);
         };
-        const QString plain = named(QStringLiteral(".jpg"));
-        const QString sheet = named(QStringLiteral(".jpp"));
+        const QString plain = named(u".jpg"_s);
+        const QString sheet = named(u".jpp"_s);
         const bool hasPlain = m_log.layout == OrderLog::Layout::Edited && has(plain);
         if (hasPlain)
             checkSheet(plain);
@@ -103,7 +102,7 @@ private:
         const Result<QByteArray> sheet = readHostFile(m_folder / toHostPath(name));
         const Result<void> whole = sheet ? checkWholeJpeg(*sheet) : Result<void>(sheet.failure());
         if (!whole)
-            fault(QStringLiteral("%1: %2").arg(name, whole.failure().message));
+            fault(u"%1: %2"_s.arg(name, whole.failure().message));
     }
 
     void checkPrintFile(const QString& name) {
@@ -114,7 +113,7 @@ private:
         if (whole)
             ++m_report.prints;
         else
-            fault(QStringLiteral("%1: %2").arg(name, whole.failure().message));
+            fault(u"%1: %2"_s.arg(name, whole.failure().message));
         if (content)
             checkTail(name, content->tail);
         checkName(name);
@@ -131,8 +130,8 @@ private:
             while (wanted.endsWith(u' '))
                 wanted.chop(1);
             if (found != wanted)
-                fault(QStringLiteral("%1: the tail's %2 is \"%3\", the log has \"%4\"")
-                          .arg(name, QLatin1String(what), found, wanted));
+                fault(
+                    u"%1: the tail's %2 is \"%3\", the log has \"%4\""_s.arg(name, QLatin1String(what), found, wanted));
         };
         if (customerKnown) {
             compare("telephone", tail->telephone, m_tail.telephone, 10);
@@ -146,7 +145,7 @@ private:
     void checkName(const QString& name) {
         const std::optional<PrintFileName> parts = PrintFileName::parse(name);
         if (!parts) {
-            fault(QStringLiteral("%1: not the name of a print file").arg(name));
+            fault(u"%1: not the name of a print file"_s.arg(name));
             return;
         }
         // The name holds only the last four digits of the line's number, so each line 10000 further on is tried too.
@@ -158,10 +157,9 @@ private:
                 m_made.insert(static_cast<int>(i), name);
         }
         if (!found)
-            fault(QStringLiteral("%1: no line of the log has this place, code and picture").arg(name));
+            fault(u"%1: no line of the log has this place, code and picture"_s.arg(name));
         if (parts->optint != static_cast<int>(m_log.Optint))
-            fault(QStringLiteral("%1: the kind of order is %2, the log has %3")
-                      .arg(name)
+            fault(u"%1: the kind of order is %2, the log has %3"_s.arg(name)
                       .arg(parts->optint)
                       .arg(static_cast<int>(m_log.Optint)));
     }
@@ -171,9 +169,8 @@ private:
             const BasketLine item = m_log.line(i);
             const bool excused = !item.hasUsableName() || m_log.failed.contains(item.path.text());
             if (!m_made.contains(static_cast<int>(i)) && !excused)
-                fault(QStringLiteral("line %1 of the basket (%2) has no print file and is not named as failed")
-                          .arg(i)
-                          .arg(item.path.text()));
+                fault(u"line %1 of the basket (%2) has no print file and is not named as failed"_s.arg(i).arg(
+                    item.path.text()));
         }
     }
 
@@ -191,46 +188,45 @@ Result<QByteArray> readHostFile(const fs::path& path) {
     QFile file(toText(path));
     if (!file.open(QIODevice::ReadOnly)) {
         const auto kind = file.exists() ? Failure::Kind::AccessDenied : Failure::Kind::NotFound;
-        return Failure{kind, QStringLiteral("%1: %2").arg(toText(path), file.errorString())};
+        return Failure{kind, u"%1: %2"_s.arg(toText(path), file.errorString())};
     }
     QByteArray bytes = file.readAll();
     if (file.error() != QFileDevice::NoError)
-        return Failure{Failure::Kind::Other, QStringLiteral("%1: %2").arg(toText(path), file.errorString())};
+        return Failure{Failure::Kind::Other, u"%1: %2"_s.arg(toText(path), file.errorString())};
     return bytes;
 }
 
 Result<void> checkWholeJpeg(const QByteArray& bytes) {
     if (!bytes.startsWith("\xFF\xD8"))
-        return Failure{Failure::Kind::Damaged, QStringLiteral("what it holds is no JPEG picture")};
+        return Failure{Failure::Kind::Damaged, u"what it holds is no JPEG picture"_s};
     QTemporaryFile file;
     if (!file.open() || file.write(bytes) != bytes.size() || !file.flush())
-        return Failure{Failure::Kind::Other, QStringLiteral("%1: %2").arg(file.fileName(), file.errorString())};
+        return Failure{Failure::Kind::Other, u"%1: %2"_s.arg(file.fileName(), file.errorString())};
     const Result<Bitmap> picture = loadPicture(toHostPath(file.fileName()));
     if (!picture)
-        return Failure{Failure::Kind::Damaged, QStringLiteral("its picture is damaged or cut short")};
+        return Failure{Failure::Kind::Damaged, u"its picture is damaged or cut short"_s};
     return {};
 }
 
 Result<OrderFindings> checkOrderFolder(const fs::path& folder, PrintFileShape shape) {
     std::error_code error;
     if (!fs::is_directory(folder, error))
-        return Failure{Failure::Kind::NotFound, QStringLiteral("%1: no such folder").arg(toText(folder))};
+        return Failure{Failure::Kind::NotFound, u"%1: no such folder"_s.arg(toText(folder))};
     const QString name = toText(fs::weakly_canonical(folder, error).filename());
     QStringList logs = namesWith(folder, ".txt");
-    if (logs.contains(name + QStringLiteral(".txt")))
-        logs = {name + QStringLiteral(".txt")};
+    if (logs.contains(name + u".txt"_s))
+        logs = {name + u".txt"_s};
     if (logs.size() != 1)
         return Failure{Failure::Kind::NotFound,
-                       logs.isEmpty()
-                           ? QStringLiteral("%1: holds no order log").arg(toText(folder))
-                           : QStringLiteral("%1: holds several logs, none of its own name").arg(toText(folder))};
+                       logs.isEmpty() ? u"%1: holds no order log"_s.arg(toText(folder))
+                                      : u"%1: holds several logs, none of its own name"_s.arg(toText(folder))};
     const Result<QByteArray> bytes = readHostFile(folder / toHostPath(logs[0]));
     if (!bytes)
         return bytes.failure();
     OrderLog log;
     log.read(*bytes);
     if (log.Hazmana.isEmpty())
-        return Failure{Failure::Kind::Damaged, QStringLiteral("%1: no order log").arg(logs[0])};
+        return Failure{Failure::Kind::Damaged, u"%1: no order log"_s.arg(logs[0])};
     return Check(folder, shape, std::move(log)).run(name);
 }
 

@@ -6,6 +6,9 @@
 #include <variant>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 using Field = std::variant<QString*, std::int16_t*, bool*, OrderKind*, Sender*>;
@@ -18,59 +21,59 @@ struct Choice {
 QList<Choice> choicesIn(SessionState& state) {
     OrderDetails& shemot = state.shemot;
     AlbumDetails& album = state.album;
-    QList<Choice> choices = {{QStringLiteral("Optint"), &state.Optint},
-                             {QStringLiteral("MisparHazmana"), &state.MisparHazmana},
-                             {QStringLiteral("HazmanaP"), &state.transfer.HazmanaP},
-                             {QStringLiteral("SugSheliach"), &state.transfer.SugSheliach},
-                             {QStringLiteral("KodMishloach"), &state.KodMishloach},
-                             {QStringLiteral("KodMishloachMakor"), &state.KodMishloachMakor},
-                             {QStringLiteral("MishloachHabaita"), &state.MishloachHabaita},
-                             {QStringLiteral("EnglishTips"), &state.EnglishTips},
-                             {QStringLiteral("TachanaMekomit"), &state.TachanaMekomit},
-                             {QStringLiteral("TmunatPaar"), &state.TmunatPaar},
-                             {QStringLiteral("ModulRezef"), &state.ModulRezef},
-                             {QStringLiteral("DchisaAmoka"), &state.DchisaAmoka},
-                             {QStringLiteral("SugTzad"), &state.SugTzad},
-                             {QStringLiteral("BranchChoice"), &state.BranchChoice},
-                             {QStringLiteral("Shemot.n1"), &shemot.n1},
-                             {QStringLiteral("Shemot.n2"), &shemot.n2},
-                             {QStringLiteral("Shemot.n3"), &shemot.n3},
-                             {QStringLiteral("Shemot.n4"), &shemot.n4},
-                             {QStringLiteral("Shemot.Mail"), &shemot.Mail},
-                             {QStringLiteral("Shemot.FillFit"), &shemot.FillFit},
-                             {QStringLiteral("Shemot.Hearot"), &shemot.Hearot},
-                             {QStringLiteral("Shemot.Bord"), &shemot.Bord},
-                             {QStringLiteral("Shemot.ppr"), &shemot.ppr},
-                             {QStringLiteral("Shemot.maat"), &shemot.maat},
-                             {QStringLiteral("Shemot.ser"), &shemot.ser},
-                             {QStringLiteral("Shemot.TotalPics"), &shemot.TotalPics},
-                             {QStringLiteral("Shemot.Soog1"), &shemot.Soog1},
-                             {QStringLiteral("Shemot.Soog2"), &shemot.Soog2},
-                             {QStringLiteral("Shemot.CustomCode"), &shemot.CustomCode},
-                             {QStringLiteral("Shemot.TimeOfJob"), &shemot.TimeOfJob},
-                             {QStringLiteral("Shemot.Girsa"), &shemot.Girsa},
-                             {QStringLiteral("ShemZalam"), &album.ShemZalam},
-                             {QStringLiteral("ShemErooa"), &album.ShemErooa},
-                             {QStringLiteral("TelZalam"), &album.TelZalam},
-                             {QStringLiteral("MailZalam"), &album.MailZalam},
-                             {QStringLiteral("SoogLBM"), &album.SoogLBM},
-                             {QStringLiteral("SoogKricha"), &album.SoogKricha},
-                             {QStringLiteral("SoogNiar"), &album.SoogNiar},
-                             {QStringLiteral("GodelLBM"), &album.GodelLBM},
-                             {QStringLiteral("HearotLBM"), &album.HearotLBM},
-                             {QStringLiteral("KamutHorim"), &album.KamutHorim},
-                             {QStringLiteral("SoogHorim"), &album.SoogHorim}};
+    QList<Choice> choices = {{u"Optint"_s, &state.Optint},
+                             {u"MisparHazmana"_s, &state.MisparHazmana},
+                             {u"HazmanaP"_s, &state.transfer.HazmanaP},
+                             {u"SugSheliach"_s, &state.transfer.SugSheliach},
+                             {u"KodMishloach"_s, &state.KodMishloach},
+                             {u"KodMishloachMakor"_s, &state.KodMishloachMakor},
+                             {u"MishloachHabaita"_s, &state.MishloachHabaita},
+                             {u"EnglishTips"_s, &state.EnglishTips},
+                             {u"TachanaMekomit"_s, &state.TachanaMekomit},
+                             {u"TmunatPaar"_s, &state.TmunatPaar},
+                             {u"ModulRezef"_s, &state.ModulRezef},
+                             {u"DchisaAmoka"_s, &state.DchisaAmoka},
+                             {u"SugTzad"_s, &state.SugTzad},
+                             {u"BranchChoice"_s, &state.BranchChoice},
+                             {u"Shemot.n1"_s, &shemot.n1},
+                             {u"Shemot.n2"_s, &shemot.n2},
+                             {u"Shemot.n3"_s, &shemot.n3},
+                             {u"Shemot.n4"_s, &shemot.n4},
+                             {u"Shemot.Mail"_s, &shemot.Mail},
+                             {u"Shemot.FillFit"_s, &shemot.FillFit},
+                             {u"Shemot.Hearot"_s, &shemot.Hearot},
+                             {u"Shemot.Bord"_s, &shemot.Bord},
+                             {u"Shemot.ppr"_s, &shemot.ppr},
+                             {u"Shemot.maat"_s, &shemot.maat},
+                             {u"Shemot.ser"_s, &shemot.ser},
+                             {u"Shemot.TotalPics"_s, &shemot.TotalPics},
+                             {u"Shemot.Soog1"_s, &shemot.Soog1},
+                             {u"Shemot.Soog2"_s, &shemot.Soog2},
+                             {u"Shemot.CustomCode"_s, &shemot.CustomCode},
+                             {u"Shemot.TimeOfJob"_s, &shemot.TimeOfJob},
+                             {u"Shemot.Girsa"_s, &shemot.Girsa},
+                             {u"ShemZalam"_s, &album.ShemZalam},
+                             {u"ShemErooa"_s, &album.ShemErooa},
+                             {u"TelZalam"_s, &album.TelZalam},
+                             {u"MailZalam"_s, &album.MailZalam},
+                             {u"SoogLBM"_s, &album.SoogLBM},
+                             {u"SoogKricha"_s, &album.SoogKricha},
+                             {u"SoogNiar"_s, &album.SoogNiar},
+                             {u"GodelLBM"_s, &album.GodelLBM},
+                             {u"HearotLBM"_s, &album.HearotLBM},
+                             {u"KamutHorim"_s, &album.KamutHorim},
+                             {u"SoogHorim"_s, &album.SoogHorim}};
     for (std::size_t i = 0; i < album.Tosafot1.size(); ++i)
-        choices += {QStringLiteral("Tosafot1_%1").arg(i + 1), &album.Tosafot1[i]};
+        choices += {u"Tosafot1_%1"_s.arg(i + 1), &album.Tosafot1[i]};
     for (std::size_t i = 0; i < album.Tosafot2.size(); ++i)
-        choices += {QStringLiteral("Tosafot2_%1").arg(i + 1), &album.Tosafot2[i]};
+        choices += {u"Tosafot2_%1"_s.arg(i + 1), &album.Tosafot2[i]};
     return choices;
 }
 
 struct AsText {
     QString operator()(const QString* text) const { return *text; }
     QString operator()(const std::int16_t* number) const { return QString::number(*number); }
-    QString operator()(const bool* truth) const { return *truth ? QStringLiteral("-1") : QStringLiteral("0"); }
+    QString operator()(const bool* truth) const { return *truth ? u"-1"_s : u"0"_s; }
     template <class Enum>
     QString operator()(const Enum* kind) const {
         return QString::number(static_cast<int>(*kind));

@@ -12,6 +12,9 @@
 #include <algorithm>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 int printsNamedBy(const OrderLog& log) {
@@ -70,7 +73,7 @@ OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& 
 }
 
 OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked) {
-    const QStringList present = files.names(folder.path(), QStringLiteral("*.jpp;*.prk"));
+    const QStringList present = files.names(folder.path(), u"*.jpp;*.prk"_s);
     OrderLog log;
     if (const Result<QByteArray> bytes = files.read(folder.logPath()))
         log.read(*bytes);

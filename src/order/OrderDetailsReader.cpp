@@ -7,6 +7,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr std::array texts = {&OrderDetails::n1,   &OrderDetails::n2,      &OrderDetails::ppr,  &OrderDetails::Hearot,
@@ -22,7 +24,7 @@ void setAll(OrderDetails& details, const QString& text) {
 std::optional<OrderLog> readLog(const Files& files, const DrivePath& path, OrderDetails& details) {
     const auto bytes = files.fileExists(path) ? files.read(path) : Failure{Failure::Kind::NotFound, path.text()};
     if (!bytes) {
-        setAll(details, QStringLiteral("NO details"));
+        setAll(details, u"NO details"_s);
         return std::nullopt;
     }
     OrderLog log;

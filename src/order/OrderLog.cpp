@@ -10,6 +10,9 @@
 #include <variant>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 using Layout = OrderLog::Layout;
@@ -28,50 +31,47 @@ struct Line {
 };
 using Lines = QList<Line>;
 
-const QString totalFailed = QStringLiteral("-----------Total Failed");
-const QString failedPath = QStringLiteral("fail_");
-const QString editedFailedPath = QStringLiteral("Failed  ");
-const QString basketLine = QStringLiteral("Shoora");
+const QString totalFailed = u"-----------Total Failed"_s;
+const QString failedPath = u"fail_"_s;
+const QString editedFailedPath = u"Failed  "_s;
+const QString basketLine = u"Shoora"_s;
 
-const Line zeros{QStringLiteral("00"), Fixed{QStringLiteral("00")}};
-const Line stars{QStringLiteral("***"), Fixed{QString(45, u'*')}};
+const Line zeros{u"00"_s, Fixed{u"00"_s}};
+const Line stars{u"***"_s, Fixed{QString(45, u'*')}};
 
 // No page sets these three; the lab's reader expects their lines.
 Lines serverLines(OrderLog& log, const QString& sign) {
-    return {{QStringLiteral("KeSherLaSharat") + sign, Quoted{&log.KeSherLaSharat}},
-            {QStringLiteral("HitKasherDerech") + sign, &log.HitKasherDerech},
-            {QStringLiteral("TaooyotBaHaShvaa") + sign, &log.TaooyotBaHaShvaa}};
+    return {{u"KeSherLaSharat"_s + sign, Quoted{&log.KeSherLaSharat}},
+            {u"HitKasherDerech"_s + sign, &log.HitKasherDerech},
+            {u"TaooyotBaHaShvaa"_s + sign, &log.TaooyotBaHaShvaa}};
 }
 
 Lines nameLines(OrderLog& log, const QString& prefix) {
-    return {{prefix + QStringLiteral("Girsa"), &log.shemot.Girsa},
-            {QStringLiteral("Time"), &log.Time},
-            {QStringLiteral("Hazmana"), &log.Hazmana}};
+    return {{prefix + u"Girsa"_s, &log.shemot.Girsa}, {u"Time"_s, &log.Time}, {u"Hazmana"_s, &log.Hazmana}};
 }
 
 Lines detailLines(OrderDetails& shemot) {
-    return {{QStringLiteral("Shemot.ser"), &shemot.ser},       {QStringLiteral("Shemot.n1"), &shemot.n1},
-            {QStringLiteral("Shemot.n2"), &shemot.n2},         {QStringLiteral("Shemot.n3"), &shemot.n3},
-            {QStringLiteral("Shemot.n4"), &shemot.n4},         {QStringLiteral("Shemot.TotalPics"), &shemot.TotalPics},
-            {QStringLiteral("Shemot.Mail"), &shemot.Mail},     {QStringLiteral("Shemot.TimeOfJob"), &shemot.TimeOfJob},
-            {QStringLiteral("Shemot.Hearot"), &shemot.Hearot}, {QStringLiteral("Shemot.ppr"), &shemot.ppr},
-            {QStringLiteral("Shemot.T1"), &shemot.T1},         {QStringLiteral("Shemot.Bord"), &shemot.Bord},
-            {QStringLiteral("Shemot.maat"), &shemot.maat},     {QStringLiteral("Shemot.FillFit"), &shemot.FillFit}};
+    return {{u"Shemot.ser"_s, &shemot.ser},       {u"Shemot.n1"_s, &shemot.n1},
+            {u"Shemot.n2"_s, &shemot.n2},         {u"Shemot.n3"_s, &shemot.n3},
+            {u"Shemot.n4"_s, &shemot.n4},         {u"Shemot.TotalPics"_s, &shemot.TotalPics},
+            {u"Shemot.Mail"_s, &shemot.Mail},     {u"Shemot.TimeOfJob"_s, &shemot.TimeOfJob},
+            {u"Shemot.Hearot"_s, &shemot.Hearot}, {u"Shemot.ppr"_s, &shemot.ppr},
+            {u"Shemot.T1"_s, &shemot.T1},         {u"Shemot.Bord"_s, &shemot.Bord},
+            {u"Shemot.maat"_s, &shemot.maat},     {u"Shemot.FillFit"_s, &shemot.FillFit}};
 }
 
 // The keys count the extras from 1, the session's lists from 0; the last item of each list is not written.
 Lines albumLines(OrderLog& log) {
     AlbumDetails& album = log.album;
-    Lines lines = {
-        {QStringLiteral("ser"), &log.shemot.ser},        {QStringLiteral("TotalPics"), &log.shemot.TotalPics},
-        {QStringLiteral("GodelLBM"), &album.GodelLBM},   {QStringLiteral("Hearot"), &album.HearotLBM},
-        {QStringLiteral("MailZalam"), &album.MailZalam}, {QStringLiteral("ShemErooa"), &album.ShemErooa},
-        {QStringLiteral("ShemZalam"), &album.ShemZalam}, {QStringLiteral("SoogKricha"), &album.SoogKricha},
-        {QStringLiteral("SoogLBM"), &album.SoogLBM},     {QStringLiteral("SoogNiar"), &album.SoogNiar}};
+    Lines lines = {{u"ser"_s, &log.shemot.ser},        {u"TotalPics"_s, &log.shemot.TotalPics},
+                   {u"GodelLBM"_s, &album.GodelLBM},   {u"Hearot"_s, &album.HearotLBM},
+                   {u"MailZalam"_s, &album.MailZalam}, {u"ShemErooa"_s, &album.ShemErooa},
+                   {u"ShemZalam"_s, &album.ShemZalam}, {u"SoogKricha"_s, &album.SoogKricha},
+                   {u"SoogLBM"_s, &album.SoogLBM},     {u"SoogNiar"_s, &album.SoogNiar}};
     for (std::size_t i = 1; i < album.Tosafot1.size(); ++i)
-        lines += {QStringLiteral("Tosafot1_%1").arg(i), &album.Tosafot1[i - 1]};
+        lines += {u"Tosafot1_%1"_s.arg(i), &album.Tosafot1[i - 1]};
     for (std::size_t i = 1; i < album.Tosafot2.size(); ++i)
-        lines += {QStringLiteral("Tosafot2_%1").arg(i), &album.Tosafot2[i - 1]};
+        lines += {u"Tosafot2_%1"_s.arg(i), &album.Tosafot2[i - 1]};
     return lines;
 }
 
@@ -79,14 +79,13 @@ Lines albumLines(OrderLog& log) {
 Lines headLines(OrderLog& log, Layout layout) {
     // The lab's reader of an edited order accepts only the kind 5.
     if (layout == Layout::Edited)
-        return serverLines(log, QStringLiteral(" = ")) + Lines{zeros} + nameLines(log, QStringLiteral("Shemot.")) +
-               Lines{{QStringLiteral("Option"), Fixed{QStringLiteral("5")}}} + detailLines(log.shemot) + Lines{stars};
+        return serverLines(log, u" = "_s) + Lines{zeros} + nameLines(log, u"Shemot."_s) +
+               Lines{{u"Option"_s, Fixed{u"5"_s}}} + detailLines(log.shemot) + Lines{stars};
     const bool album = layout == Layout::Album;
     return (album ? Lines{zeros, zeros} : Lines{zeros}) + serverLines(log, {}) +
-           Lines{{QString(12, u'-'), Fixed{QString(9, u'-')}}} +
-           nameLines(log, album ? QString() : QStringLiteral("Shemot.")) +
-           Lines{{QStringLiteral("Optint"), &log.Optint}} + (album ? albumLines(log) : detailLines(log.shemot)) +
-           Lines{{QStringLiteral("More Comp = "), &log.DchisaAmoka}, stars};
+           Lines{{QString(12, u'-'), Fixed{QString(9, u'-')}}} + nameLines(log, album ? QString() : u"Shemot."_s) +
+           Lines{{u"Optint"_s, &log.Optint}} + (album ? albumLines(log) : detailLines(log.shemot)) +
+           Lines{{u"More Comp = "_s, &log.DchisaAmoka}, stars};
 }
 
 struct Writer {
@@ -112,20 +111,20 @@ struct Reader {
 };
 
 void writeFailed(ListOutput& output, const QStringList& failed) {
-    const auto blank = [&output] { output.text(QStringLiteral(" ")).endLine(); };
+    const auto blank = [&output] { output.text(u" "_s).endLine(); };
     output.pair(totalFailed, QString::number(failed.size()) + QString(11, u'-'));
     blank();
     for (const QString& path : failed)
         output.pair(failedPath, path);
     blank();
-    output.pair(QStringLiteral("-----------End"), QStringLiteral("Of Failed List-------------"));
+    output.pair(u"-----------End"_s, u"Of Failed List-------------"_s);
     blank();
     output.pair(QString(11, u'-'), QString(30, u'-'));
     blank();
 }
 
 void writeEditedFailed(ListOutput& output, const QStringList& failed) {
-    output.pair(stars.key, QStringLiteral("****    Failed    ***************************"));
+    output.pair(stars.key, u"****    Failed    ***************************"_s);
     for (const QString& path : failed)
         output.pair(editedFailedPath, path);
     output.pair(stars.key, std::get<Fixed>(stars.value).text);
@@ -133,7 +132,7 @@ void writeEditedFailed(ListOutput& output, const QStringList& failed) {
 
 Layout layoutOf(const QList<ListOutputEntry>& entries) {
     const auto opens = [&](qsizetype at, const QString& key) { return at < entries.size() && entries[at].key == key; };
-    if (opens(0, QStringLiteral("KeSherLaSharat = ")))
+    if (opens(0, u"KeSherLaSharat = "_s))
         return Layout::Edited;
     return opens(0, zeros.key) && opens(1, zeros.key) ? Layout::Album : Layout::Plain;
 }

@@ -5,6 +5,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 bool isReported(const TransferState& transfer) {
@@ -24,30 +26,29 @@ QString onOneLine(QString value) {
 
 QString PaperKindLetter(const QString& maat) {
     const auto is = [&](const QString& word) { return maat.compare(word, Qt::CaseInsensitive) == 0; };
-    if (is(QStringLiteral("מט")) || is(QStringLiteral("MAT")) || is(QStringLiteral("MATTE")))
-        return QStringLiteral("M");
-    if (is(QStringLiteral("מבריק")) || is(QStringLiteral("GLOSSY")))
-        return QStringLiteral("G");
+    if (is(u"מט"_s) || is(u"MAT"_s) || is(u"MATTE"_s))
+        return u"M"_s;
+    if (is(u"מבריק"_s) || is(u"GLOSSY"_s))
+        return u"G"_s;
     return {};
 }
 
 QString OrderReportQuery(const ClientProfile& profile, const TransferState& transfer, const OrderDetails& shemot) {
     if (!isReported(transfer))
         return {};
-    return onOneLine(QStringLiteral("?k1=") + profile.ClientCode +                           //
-                     QStringLiteral("&t1=") + transfer.ShemTikiya + QStringLiteral("    ") + //
-                     SizeCode(shemot.ppr, QStringLiteral("_")) + PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit +
-                     u'_' + shemot.Bord + QStringLiteral("&t2=Notes: ") + shemot.Hearot + //
-                     QStringLiteral("&t3=Pratim: ") + shemot.n2 + QStringLiteral("    ") + shemot.n1 +
-                     QStringLiteral("&t4=Adress: ") + shemot.n3 + //
-                     QStringLiteral("&t5=Mail: ") + shemot.Mail + //
-                     QStringLiteral("&t8=Total_pics: ") + QString::number(shemot.TotalPics));
+    return onOneLine(u"?k1="_s + profile.ClientCode +              //
+                     u"&t1="_s + transfer.ShemTikiya + u"    "_s + //
+                     SizeCode(shemot.ppr, u"_"_s) + PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit + u'_' +
+                     shemot.Bord + u"&t2=Notes: "_s + shemot.Hearot +                                        //
+                     u"&t3=Pratim: "_s + shemot.n2 + u"    "_s + shemot.n1 + u"&t4=Adress: "_s + shemot.n3 + //
+                     u"&t5=Mail: "_s + shemot.Mail +                                                         //
+                     u"&t8=Total_pics: "_s + QString::number(shemot.TotalPics));
 }
 
 QString DoneQuery(const ClientProfile& profile, const TransferState& transfer) {
     if (!isReported(transfer))
         return {};
-    return onOneLine(QStringLiteral("?t1=") + profile.ClientCode + QStringLiteral("&t2=true"));
+    return onOneLine(u"?t1="_s + profile.ClientCode + u"&t2=true"_s);
 }
 
 } // namespace lumora

@@ -9,30 +9,29 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr std::array phases = {"preparing", "prepared", "sending", "arrived", "reported"};
 constexpr std::array ways = {"ftp", "http", "station", "mail"};
 constexpr std::array reports = {"not yet", "begun", "done"};
 
-const QString choicePrefix = QStringLiteral("Choice.");
-const QString lastKey = QStringLiteral("End");
+const QString choicePrefix = u"Choice."_s;
+const QString lastKey = u"End"_s;
 
 DrivePath statePath(const OrderFolder& folder) {
-    return folder.filePath(QStringLiteral(".order"));
+    return folder.filePath(u".order"_s);
 }
 
 // A caption may hold line breaks, and behind a quote a break would end the line.
 QString withoutBreaks(QString text) {
-    return text.replace(u'%', QStringLiteral("%25"))
-        .replace(u'\r', QStringLiteral("%0D"))
-        .replace(u'\n', QStringLiteral("%0A"));
+    return text.replace(u'%', u"%25"_s).replace(u'\r', u"%0D"_s).replace(u'\n', u"%0A"_s);
 }
 
 QString withBreaks(QString text) {
-    return text.replace(QStringLiteral("%0A"), QStringLiteral("\n"))
-        .replace(QStringLiteral("%0D"), QStringLiteral("\r"))
-        .replace(QStringLiteral("%25"), QStringLiteral("%"));
+    return text.replace(u"%0A"_s, u"\n"_s).replace(u"%0D"_s, u"\r"_s).replace(u"%25"_s, u"%"_s);
 }
 
 class StateWriter {
@@ -106,7 +105,7 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
 }
 
 Failure damagedState(const QString& why) {
-    return {Failure::Kind::Damaged, QStringLiteral("the order's state %1").arg(why)};
+    return {Failure::Kind::Damaged, u"the order's state %1"_s.arg(why)};
 }
 
 } // namespace
@@ -114,20 +113,20 @@ Failure damagedState(const QString& why) {
 QByteArray OrderState::write() const {
     StateWriter writer;
     writer.word("Phase", phases, phase);
-    writer.text(QStringLiteral("MisparHazmana"), number);
-    writer.text(QStringLiteral("Shemot.ser"), serial);
-    writer.text(QStringLiteral("Optint"), QString::number(static_cast<int>(kind)));
+    writer.text(u"MisparHazmana"_s, number);
+    writer.text(u"Shemot.ser"_s, serial);
+    writer.text(u"Optint"_s, QString::number(static_cast<int>(kind)));
     writer.word("Way", ways, way);
     writer.truth("FolderMadeByUs", folderMadeByUs);
     writer.truth("ProvenByNameOnly", provenByNameOnly);
     writer.word("Report", reports, report);
     for (const QString& path : filesInHand)
-        writer.text(QStringLiteral("InHand"), path);
+        writer.text(u"InHand"_s, path);
     if (phase == Phase::Preparing) {
         for (const auto& [key, value] : choices)
             writer.text(choicePrefix + key, value);
         for (const QString& item : items)
-            writer.text(QStringLiteral("Shoora"), item);
+            writer.text(u"Shoora"_s, item);
     }
     for (const auto& [key, value] : further)
         writer.text(key, value);
@@ -139,7 +138,7 @@ Result<OrderState> OrderState::parse(const QByteArray& bytes) {
     const bool whole = bytes.endsWith("\r\n") && !entries.isEmpty() && entries.last().key == lastKey &&
                        entries.last().value == QString::number(entries.size() - 1);
     if (!whole)
-        return damagedState(QStringLiteral("is not whole"));
+        return damagedState(u"is not whole"_s);
     entries.removeLast();
     OrderState state;
     bool phaseTold = false;
@@ -148,10 +147,10 @@ Result<OrderState> OrderState::parse(const QByteArray& bytes) {
         const QString value = withBreaks(writtenValue);
         phaseTold = phaseTold || key == u"Phase";
         if (!takeEntry(state, key, value))
-            return damagedState(QStringLiteral("has \"%1\" for %2").arg(value, key));
+            return damagedState(u"has \"%1\" for %2"_s.arg(value, key));
     }
     if (!phaseTold)
-        return damagedState(QStringLiteral("has no phase"));
+        return damagedState(u"has no phase"_s);
     return state;
 }
 
@@ -166,7 +165,7 @@ Result<OrderState> ReadOrderState(const Files& files, const OrderFolder& folder)
         return bytes.failure();
     Result<OrderState> state = OrderState::parse(*bytes);
     if (!state)
-        return Failure{state.failure().kind, QStringLiteral("%1: %2").arg(path.text(), state.failure().message)};
+        return Failure{state.failure().kind, u"%1: %2"_s.arg(path.text(), state.failure().message)};
     return state;
 }
 

@@ -5,6 +5,9 @@
 #include "session/SessionState.h"
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The text is converted to the code page before it is cut, so that width counts bytes.
@@ -21,8 +24,8 @@ OrderTail OrderTail::of(const SessionState& state) {
 
 QByteArray OrderTail::shortForm() const {
     // The first two fields once held the number of a split print's piece and the count of pieces; both are always 1.
-    return field(QStringLiteral("1"), 2) + field(QStringLiteral("1"), 2) + field(telephone, 10) + field(name, 10) +
-           field(totalPics, 3) + field(orderNumber, 3) + field(serial, 4) + field({}, 6);
+    return field(u"1"_s, 2) + field(u"1"_s, 2) + field(telephone, 10) + field(name, 10) + field(totalPics, 3) +
+           field(orderNumber, 3) + field(serial, 4) + field({}, 6);
 }
 
 QByteArray OrderTail::longForm(const QString& base) const {

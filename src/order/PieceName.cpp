@@ -4,6 +4,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int tailLength = 12;
@@ -16,7 +18,7 @@ QString without(const QString& text, int last) {
 } // namespace
 
 bool IsPiece(const QString& name) {
-    return name.endsWith(QStringLiteral("prk"));
+    return name.endsWith(u"prk"_s);
 }
 
 QString PieceStem(const QString& leaf) {
@@ -24,7 +26,7 @@ QString PieceStem(const QString& leaf) {
 }
 
 QString PieceTail(int sequence, const QString& total) {
-    return u'_' + PieceNumber(sequence) + u'_' + total + QStringLiteral(".prk");
+    return u'_' + PieceNumber(sequence) + u'_' + total + u".prk"_s;
 }
 
 QString PieceNumber(int number) {

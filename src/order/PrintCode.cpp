@@ -7,6 +7,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 QString PrintCode::compose() const {
     return copiesField(copies) + LeftField(size, 4) + paper + LeftField(border, 2);
 }
@@ -28,9 +30,9 @@ std::int16_t sumOfCopies(const QStringList& texts, CopiesIn carriers) {
 
 QChar paperLetter(const QString& maat, PaperWords words, QChar previous) {
     const bool all = words == PaperWords::All;
-    if (maat == QStringLiteral("מט") || maat == QStringLiteral("M") || (all && maat == QStringLiteral("Matte")))
+    if (maat == u"מט"_s || maat == u"M"_s || (all && maat == u"Matte"_s))
         return u'M';
-    if (maat == QStringLiteral("מבריק") || (all && maat == QStringLiteral("Glossy")))
+    if (maat == u"מבריק"_s || (all && maat == u"Glossy"_s))
         return u'G';
     return previous;
 }

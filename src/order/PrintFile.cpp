@@ -8,6 +8,9 @@
 #include <optional>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr qint64 markerWidth = 10; // characters of the field with base + piece length
@@ -20,8 +23,7 @@ Failure damaged(const QString& reason) {
 std::optional<Failure> outOfRange(PrintFileShape shape) {
     if (shape.chunks >= 1 && shape.chunks <= 32767)
         return std::nullopt;
-    return Failure{Failure::Kind::Unsupported,
-                   QStringLiteral("A print file has 1 to 32767 pieces, not %1.").arg(shape.chunks)};
+    return Failure{Failure::Kind::Unsupported, u"A print file has 1 to 32767 pieces, not %1."_s.arg(shape.chunks)};
 }
 
 // Reads the noted piece length: digits, then blanks to the end of the field. No value when the field is wrong.
@@ -118,12 +120,10 @@ Result<PrintFileContent> readPrintFile(const QByteArray& bytes, PrintFileShape s
         return content;
     }
     if (markerSeen)
-        return damaged(QStringLiteral("The file does not fall into %1 numbered pieces of the length that it notes "
-                                      "(base %2).")
-                           .arg(shape.chunks)
+        return damaged(u"The file does not fall into %1 numbered pieces of the length that it notes "
+                       u"(base %2)."_s.arg(shape.chunks)
                            .arg(shape.base));
-    return damaged(
-        QStringLiteral("No length of a piece stands before the tail: no print file, or one of another base."));
+    return damaged(u"No length of a piece stands before the tail: no print file, or one of another base."_s);
 }
 
 } // namespace lumora

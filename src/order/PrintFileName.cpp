@@ -8,14 +8,16 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 QString PrintFileName::text() const {
     return code.left(PrintCode::width) + ZeroPadded(index, 4) + u'_' + QString::number(optint).rightJustified(2, u'0') +
-           TextToHex(RightPart(AnsiCodePage::squeeze(baseName), 20)) + QStringLiteral(".jpp");
+           TextToHex(RightPart(AnsiCodePage::squeeze(baseName), 20)) + u".jpp"_s;
 }
 
 std::optional<PrintFileName> PrintFileName::parse(const QString& name) {
-    static const QRegularExpression form(QRegularExpression::anchoredPattern(
-        QStringLiteral("(.{9})([0-9]{4})_([0-9]{2})((?:[0-9A-F]{2}){1,20})\\.jpp")));
+    static const QRegularExpression form(
+        QRegularExpression::anchoredPattern(u"(.{9})([0-9]{4})_([0-9]{2})((?:[0-9A-F]{2}){1,20})\\.jpp"_s));
     const QRegularExpressionMatch match = form.match(name);
     if (!match.hasMatch())
         return std::nullopt;

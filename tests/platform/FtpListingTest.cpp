@@ -5,6 +5,9 @@
 #include <gtest/gtest.h>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 TEST(ParseFtpListing, ReadsALineByItsFieldsAndTheRestAsTheName) {
@@ -69,10 +72,10 @@ TEST(ParseFtpListing, TellsTheLineThatItCannotRead) {
     } cases[] = {
         {"", {}},
         {"total 0\r\n", {}},
-        {"\r\ninsgesamt 12\r\n" + line, {QStringLiteral("a.jpp")}},
-        {line + "total 12\r\n", {QStringLiteral("a.jpp")}, "total 12"},
-        {line + "b.jpp\r\n", {QStringLiteral("a.jpp")}, "b.jpp"},
-        {"000.jpg\r\n2026 of ^105\n", {QStringLiteral("000.jpg"), QStringLiteral("2026 of ^105")}},
+        {"\r\ninsgesamt 12\r\n" + line, {u"a.jpp"_s}},
+        {line + "total 12\r\n", {u"a.jpp"_s}, "total 12"},
+        {line + "b.jpp\r\n", {u"a.jpp"_s}, "b.jpp"},
+        {"000.jpg\r\n2026 of ^105\n", {u"000.jpg"_s, u"2026 of ^105"_s}},
         {"000.jpg\r\nls: not found\r\n", {}, "000.jpg"},
         {"orders/000.jpg\r\n", {}, "orders/000.jpg"},
         {"A.TXT;1   12/34   21-NOV-2026 03:47\r\n", {}, "A.TXT;1   12/34   21-NOV-2026 03:47"},

@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 enum class Takes {
@@ -152,7 +154,7 @@ QString takePlace(Rest& rest, QPointF& place) {
         const QString word = rest.word();
         const std::optional<double> percent = numberIn(word);
         if (!percent || *percent > 100)
-            return QStringLiteral("a percentage is wanted, not \"%1\"").arg(word);
+            return u"a percentage is wanted, not \"%1\""_s.arg(word);
         *side = *percent;
     }
     return {};
@@ -162,8 +164,7 @@ QString takePlace(Rest& rest, QPointF& place) {
 QString take(Takes what, Rest& rest, ScenarioCommand& command) {
     if (what == Takes::Text || what == Takes::SomeText) {
         command.text = unescaped(rest.text());
-        return what == Takes::SomeText && command.text.trimmed().isEmpty() ? QStringLiteral("a text is missing")
-                                                                           : QString();
+        return what == Takes::SomeText && command.text.trimmed().isEmpty() ? u"a text is missing"_s : QString();
     }
     if (what == Takes::OptionalSeconds) {
         command.seconds = patienceOfPage;
@@ -178,7 +179,7 @@ QString take(Takes what, Rest& rest, ScenarioCommand& command) {
 
     const QString word = rest.word();
     if (word.isEmpty() || word.startsWith(u'#'))
-        return QStringLiteral("the line ends too early");
+        return u"the line ends too early"_s;
     const std::optional<double> number = numberIn(word);
     switch (what) {
     case Takes::Page:
@@ -189,38 +190,38 @@ QString take(Takes what, Rest& rest, ScenarioCommand& command) {
         command.page = word.left(dot);
         command.control = word.mid(dot + 1);
         if (dot < 1 || command.control.isEmpty())
-            return QStringLiteral("PAGE.CONTROL is wanted, not \"%1\"").arg(word);
+            return u"PAGE.CONTROL is wanted, not \"%1\""_s.arg(word);
         return {};
     }
     case Takes::Word:
         command.text = word;
         if (word.contains(u'/'))
-            return QStringLiteral("a name without \"/\" is wanted, not \"%1\"").arg(word);
+            return u"a name without \"/\" is wanted, not \"%1\""_s.arg(word);
         return {};
     case Takes::Seconds:
     case Takes::OptionalSeconds:
     case Takes::Milliseconds:
         if (!number)
-            return QStringLiteral("a time is wanted, not \"%1\"").arg(word);
+            return u"a time is wanted, not \"%1\""_s.arg(word);
         command.seconds = what == Takes::Milliseconds ? *number / 1000 : *number;
         return {};
     case Takes::Number:
         if (!number || *number != std::floor(*number) || *number > 1e9)
-            return QStringLiteral("a whole number is wanted, not \"%1\"").arg(word);
+            return u"a whole number is wanted, not \"%1\""_s.arg(word);
         command.number = static_cast<int>(*number);
         return {};
     case Takes::Flag:
     case Takes::YesNo: {
-        const QString on = what == Takes::Flag ? QStringLiteral("1") : QStringLiteral("yes");
-        const QString off = what == Takes::Flag ? QStringLiteral("0") : QStringLiteral("no");
+        const QString on = what == Takes::Flag ? u"1"_s : u"yes"_s;
+        const QString off = what == Takes::Flag ? u"0"_s : u"no"_s;
         command.yes = word == on;
         if (word != on && word != off)
-            return QStringLiteral("%1 or %2 is wanted, not \"%3\"").arg(on, off, word);
+            return u"%1 or %2 is wanted, not \"%3\""_s.arg(on, off, word);
         return {};
     }
     case Takes::OptionalRight:
         command.rightKey = true;
-        return word == u"right" ? QString() : QStringLiteral("right or nothing is wanted, not \"%1\"").arg(word);
+        return word == u"right" ? QString() : u"right or nothing is wanted, not \"%1\""_s.arg(word);
     case Takes::From:
     case Takes::To:
     case Takes::Text:
@@ -236,15 +237,15 @@ QString parseLine(const QString& text, ScenarioCommand& command) {
     const auto grammar = std::find_if(grammars().begin(), grammars().end(),
                                       [&](const Grammar& one) { return verb == QLatin1StringView(one.word); });
     if (grammar == grammars().end())
-        return QStringLiteral("there is no command \"%1\"").arg(verb);
+        return u"there is no command \"%1\""_s.arg(verb);
     command.verb = grammar->verb;
     for (const Takes what : grammar->takes) {
         const QString wrong = take(what, rest, command);
         if (!wrong.isEmpty())
-            return QStringLiteral("%1: %2 (%1 %3)").arg(verb, wrong, QLatin1StringView(grammar->help));
+            return u"%1: %2 (%1 %3)"_s.arg(verb, wrong, QLatin1StringView(grammar->help));
     }
     if (!rest.nothingLeft())
-        return QStringLiteral("%1: too much on the line: \"%2\"").arg(verb, rest.text().trimmed());
+        return u"%1: too much on the line: \"%2\""_s.arg(verb, rest.text().trimmed());
     return {};
 }
 
@@ -254,7 +255,7 @@ Result<ScenarioFile> ScenarioFile::parse(const QByteArray& bytes, const QString&
     QStringDecoder decoder(QStringDecoder::Utf8);
     const QString whole = decoder(bytes);
     if (decoder.hasError())
-        return Failure{Failure::Kind::Damaged, QStringLiteral("%1:1: the file is not in UTF-8").arg(name)};
+        return Failure{Failure::Kind::Damaged, u"%1:1: the file is not in UTF-8"_s.arg(name)};
 
     ScenarioFile file;
     file.m_name = name;
@@ -270,7 +271,7 @@ Result<ScenarioFile> ScenarioFile::parse(const QByteArray& bytes, const QString&
         command.line = number;
         const QString wrong = parseLine(line, command);
         if (!wrong.isEmpty())
-            return Failure{Failure::Kind::Damaged, QStringLiteral("%1:%2: %3").arg(name).arg(number).arg(wrong)};
+            return Failure{Failure::Kind::Damaged, u"%1:%2: %3"_s.arg(name).arg(number).arg(wrong)};
         file.m_commands.push_back(std::move(command));
     }
     return file;
@@ -279,14 +280,14 @@ Result<ScenarioFile> ScenarioFile::parse(const QByteArray& bytes, const QString&
 Result<ScenarioFile> ScenarioFile::load(const QString& hostPath) {
     QFile file(hostPath);
     if (!file.open(QIODevice::ReadOnly))
-        return Failure{Failure::Kind::NotFound, QStringLiteral("%1: %2").arg(hostPath, file.errorString())};
+        return Failure{Failure::Kind::NotFound, u"%1: %2"_s.arg(hostPath, file.errorString())};
     return parse(file.readAll(), hostPath);
 }
 
 QString scenarioHelp() {
     QString text;
     for (const Grammar& grammar : grammars())
-        text += QStringLiteral("  %1 %2\n").arg(QLatin1StringView(grammar.word), QLatin1StringView(grammar.help));
+        text += u"  %1 %2\n"_s.arg(QLatin1StringView(grammar.word), QLatin1StringView(grammar.help));
     return text;
 }
 

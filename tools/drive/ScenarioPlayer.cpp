@@ -19,6 +19,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int betweenSteps = 5;         // milliseconds
@@ -33,7 +35,7 @@ bool touches(ScenarioVerb verb) {
 
 QString quoted(const QString& text) {
     QString shown = text;
-    shown.replace(u'\\', QStringLiteral("\\\\")).replace(u'\n', QStringLiteral("\\n"));
+    shown.replace(u'\\', u"\\\\"_s).replace(u'\n', u"\\n"_s);
     return u'"' + shown + u'"';
 }
 
@@ -44,7 +46,7 @@ QString inWords(const Result<int>& count) {
     return count ? QString::number(*count) : count.failure().message;
 }
 QString inWords(const Result<bool>& flag) {
-    return !flag ? flag.failure().message : *flag ? QStringLiteral("yes") : QStringLiteral("no");
+    return !flag ? flag.failure().message : *flag ? u"yes"_s : u"no"_s;
 }
 
 } // namespace
@@ -78,12 +80,12 @@ void ScenarioPlayer::step() {
         return;
     }
     if (m_program.chain().hasEnded())
-        return fail(place(), QStringLiteral("a running program"), QStringLiteral("it has ended"));
+        return fail(place(), u"a running program"_s, u"it has ended"_s);
 
     const ScenarioCommand& command = m_files[m_file].commands()[m_command];
     if (!mayRunNow(command.verb)) {
         if (m_atThisLine.elapsed() > patienceOfWork * 1000)
-            fail(place(), QStringLiteral("the end of the work before this line"), QStringLiteral("work without end"));
+            fail(place(), u"the end of the work before this line"_s, u"work without end"_s);
         return;
     }
     if (touches(command.verb))
@@ -129,7 +131,7 @@ void ScenarioPlayer::touch(const ScenarioCommand& command) {
     m_program.window().renderNow();
     const Result<void> touched = use(command);
     if (!touched)
-        fail(here, QStringLiteral("%1.%2 in reach").arg(command.page, command.control), touched.failure().message);
+        fail(here, u"%1.%2 in reach"_s.arg(command.page, command.control), touched.failure().message);
 }
 
 Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
@@ -169,8 +171,8 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
     switch (command.verb) {
     case ScenarioVerb::Page: {
         const QString front = m_controls.frontPage();
-        return {front == command.page, QStringLiteral("page %1").arg(command.page),
-                front.isEmpty() ? QStringLiteral("no page") : QStringLiteral("page %1").arg(front), command.seconds};
+        return {front == command.page, u"page %1"_s.arg(command.page),
+                front.isEmpty() ? u"no page"_s : u"page %1"_s.arg(front), command.seconds};
     }
     case ScenarioVerb::Expect:
     case ScenarioVerb::Until: {
@@ -180,19 +182,17 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
     case ScenarioVerb::ExpectVisible:
     case ScenarioVerb::UntilVisible: {
         const Result<bool> visible = m_controls.visible(command.page, command.control);
-        return {visible && *visible == command.yes,
-                name + (command.yes ? QStringLiteral(" visible: yes") : QStringLiteral(" visible: no")),
+        return {visible && *visible == command.yes, name + (command.yes ? u" visible: yes"_s : u" visible: no"_s),
                 inWords(visible), command.seconds};
     }
     case ScenarioVerb::ExpectCount: {
         const Result<int> count = m_controls.count(command.page, command.control);
-        return {count && *count == command.number, QStringLiteral("%1 count %2").arg(name).arg(command.number),
-                inWords(count)};
+        return {count && *count == command.number, u"%1 count %2"_s.arg(name).arg(command.number), inWords(count)};
     }
     case ScenarioVerb::ExpectItem: {
         const Result<QString> item = m_controls.item(command.page, command.control, command.number);
-        return {item && *item == command.text,
-                QStringLiteral("%1 item %2 ").arg(name).arg(command.number) + quoted(command.text), inWords(item)};
+        return {item && *item == command.text, u"%1 item %2 "_s.arg(name).arg(command.number) + quoted(command.text),
+                inWords(item)};
     }
     case ScenarioVerb::ExpectMessage:
         return lookForMessage(command.text);
@@ -221,12 +221,12 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
 
 ScenarioPlayer::Look ScenarioPlayer::lookForMessage(const QString& wanted) {
     const QStringList& shown = m_program.dialogs().shownTexts;
-    const QString said = QStringLiteral("the message ") + quoted(wanted);
+    const QString said = u"the message "_s + quoted(wanted);
     if (m_messagesTaken >= shown.size())
-        return {false, said, QStringLiteral("no message"), patienceOfMessage};
+        return {false, said, u"no message"_s, patienceOfMessage};
     // Some texts end their lines with a carriage return, which a scenario can't contain.
     QString oldest = shown[m_messagesTaken++];
-    oldest.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n');
+    oldest.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     return {oldest == wanted, said, quoted(oldest)};
 }
 
@@ -235,7 +235,7 @@ ScenarioPlayer::Look ScenarioPlayer::waitForPause(double seconds) const {
 }
 
 ScenarioPlayer::Look ScenarioPlayer::dump(const ScenarioCommand& command) const {
-    const QString wanted = QStringLiteral("what %1.%2 holds in %3").arg(command.page, command.control, command.text);
+    const QString wanted = u"what %1.%2 holds in %3"_s.arg(command.page, command.control, command.text);
     QString content;
     if (const Result<int> count = m_controls.count(command.page, command.control)) {
         for (int i = 0; i < *count; ++i) {
@@ -256,9 +256,9 @@ ScenarioPlayer::Look ScenarioPlayer::dump(const ScenarioCommand& command) const 
 }
 
 ScenarioPlayer::Look ScenarioPlayer::shoot(const QString& name) const {
-    const QString path = QDir(m_shots).filePath(name + QStringLiteral(".png"));
-    return {QDir().mkpath(m_shots) && m_program.window().grab().save(path, "PNG"),
-            QStringLiteral("the picture ") + path, QStringLiteral("it can't be written")};
+    const QString path = QDir(m_shots).filePath(name + u".png"_s);
+    return {QDir().mkpath(m_shots) && m_program.window().grab().save(path, "PNG"), u"the picture "_s + path,
+            u"it can't be written"_s};
 }
 
 ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
@@ -266,12 +266,12 @@ ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
     const Files& files = m_program.platform().files;
     DrivePath path = files.drives().toDrive(toHostPath(picked.canonicalFilePath()));
     if (picked.isDir()) {
-        const QStringList pictures = files.names(path, QStringLiteral("*.jpg;*.jpeg"));
+        const QStringList pictures = files.names(path, u"*.jpg;*.jpeg"_s);
         if (pictures.isEmpty())
-            return {false, QStringLiteral("a picture in ") + hostPath, QStringLiteral("none")};
+            return {false, u"a picture in "_s + hostPath, u"none"_s};
         path = path / pictures.front();
     } else if (!picked.isFile()) {
-        return {false, QStringLiteral("the file ") + hostPath, QStringLiteral("it does not exist")};
+        return {false, u"the file "_s + hostPath, u"it does not exist"_s};
     }
     m_picks += DrivePath(AnsiCodePage::squeeze(path.text()));
     return {true, {}, {}};
@@ -280,15 +280,15 @@ ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
 std::optional<DrivePath> ScenarioPlayer::takePick() {
     if (!m_picks.isEmpty())
         return m_picks.takeFirst();
-    fail(place(), QStringLiteral("no file dialog"), QStringLiteral("one, and no pick was prepared for it"));
+    fail(place(), u"no file dialog"_s, u"one, and no pick was prepared for it"_s);
     return DrivePath();
 }
 
 std::optional<bool> ScenarioPlayer::takeAnswer() {
     if (!m_answers.isEmpty())
         return m_answers.takeFirst();
-    fail(place(), QStringLiteral("no question"),
-         QStringLiteral("one, and no answer was prepared for it: ") +
+    fail(place(), u"no question"_s,
+         u"one, and no answer was prepared for it: "_s +
              quoted(m_program.dialogs().shownTexts.value(m_program.dialogs().shownTexts.size() - 1)));
     return false;
 }
@@ -300,15 +300,15 @@ void ScenarioPlayer::moveOn() {
 
 QString ScenarioPlayer::place() const {
     if (m_file == m_files.size())
-        return QStringLiteral("at the end");
+        return u"at the end"_s;
     const ScenarioFile& file = m_files[m_file];
     const std::size_t command = std::min(m_command, file.commands().size() - 1);
-    return QStringLiteral("%1:%2").arg(file.name()).arg(file.commands()[command].line);
+    return u"%1:%2"_s.arg(file.name()).arg(file.commands()[command].line);
 }
 
 void ScenarioPlayer::fail(const QString& where, const QString& wanted, const QString& found) {
     if (m_failure.isEmpty())
-        m_failure = QStringLiteral("%1: wanted %2, found %3").arg(where, wanted, found);
+        m_failure = u"%1: wanted %2, found %3"_s.arg(where, wanted, found);
     finish();
 }
 

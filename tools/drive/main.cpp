@@ -7,6 +7,8 @@
 #include <cstdio>
 #include <cstdlib>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -37,40 +39,34 @@ int play(int argc, char** argv) {
 
     QCommandLineParser parser;
     parser.setApplicationDescription(
-        QStringLiteral("Runs the pages of lumora without a screen and does at them what scenario files say, a command "
-                       "a line:\n\n") +
+        u"Runs the pages of lumora without a screen and does at them what scenario files say, a command "
+        u"a line:\n\n"_s +
         scenarioHelp() +
-        QStringLiteral("\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n"
-                       "Exit status: 0 all held, 1 a line failed, 2 nothing could be played, 3 another program "
-                       "has the data folder."));
+        u"\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n"
+        u"Exit status: 0 all held, 1 a line failed, 2 nothing could be played, 3 another program "
+        u"has the data folder."_s);
     parser.addHelpOption();
     parser.addVersionOption();
-    parser.addOptions(
-        {{QStringLiteral("lab"), QStringLiteral("The deployment file of the lab."), QStringLiteral("FILE")},
-         {QStringLiteral("size"), QStringLiteral("The window, from 640x480 on."), QStringLiteral("WxH"),
-          QStringLiteral("1280x1024")},
-         {QStringLiteral("shots"), QStringLiteral("Where the pictures of shot go."), QStringLiteral("DIR"),
-          QStringLiteral(".")}});
-    parser.addPositionalArgument(QStringLiteral("SCENARIO..."),
-                                 QStringLiteral("The files, played one after the other."));
+    parser.addOptions({{u"lab"_s, u"The deployment file of the lab."_s, u"FILE"_s},
+                       {u"size"_s, u"The window, from 640x480 on."_s, u"WxH"_s, u"1280x1024"_s},
+                       {u"shots"_s, u"Where the pictures of shot go."_s, u"DIR"_s, u"."_s}});
+    parser.addPositionalArgument(u"SCENARIO..."_s, u"The files, played one after the other."_s);
     if (!parser.parse(QCoreApplication::arguments()))
         return complain(parser.errorText(), notPlayed);
-    if (parser.isSet(QStringLiteral("help")))
+    if (parser.isSet(u"help"_s))
         parser.showHelp();
-    if (parser.isSet(QStringLiteral("version")))
+    if (parser.isSet(u"version"_s))
         parser.showVersion();
 
     ProgramOptions options;
-    options.windowSize = sizeIn(parser.value(QStringLiteral("size")));
+    options.windowSize = sizeIn(parser.value(u"size"_s));
     if (options.windowSize.isEmpty())
-        return complain(
-            QStringLiteral("--size: %1 is no size such as 1280x1024").arg(parser.value(QStringLiteral("size"))),
-            notPlayed);
-    if (parser.isSet(QStringLiteral("lab")))
-        options.labFile = toHostPath(parser.value(QStringLiteral("lab")));
+        return complain(u"--size: %1 is no size such as 1280x1024"_s.arg(parser.value(u"size"_s)), notPlayed);
+    if (parser.isSet(u"lab"_s))
+        options.labFile = toHostPath(parser.value(u"lab"_s));
 
     if (parser.positionalArguments().isEmpty())
-        return complain(QStringLiteral("No scenario is named; --help tells more."), notPlayed);
+        return complain(u"No scenario is named; --help tells more."_s, notPlayed);
     std::vector<ScenarioFile> files;
     for (const QString& path : parser.positionalArguments()) {
         Result<ScenarioFile> file = ScenarioFile::load(path);
@@ -83,7 +79,7 @@ int play(int argc, char** argv) {
     if (const Result<void> started = program.start(); !started)
         return complain(started.failure().message,
                         started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
-    ScenarioPlayer player(program, std::move(files), parser.value(QStringLiteral("shots")));
+    ScenarioPlayer player(program, std::move(files), parser.value(u"shots"_s));
     QObject::connect(&player, &ScenarioPlayer::finished, &application, &QCoreApplication::quit);
     player.start();
     QApplication::exec();

@@ -10,6 +10,8 @@
 #include <QSaveFile>
 #include <QTextStream>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 
 namespace {
@@ -32,7 +34,7 @@ Result<PrintFileContent> readFile(const QString& path, PrintFileShape shape) {
         return bytes.failure();
     Result<PrintFileContent> content = readPrintFile(*bytes, shape);
     if (!content)
-        return Failure{content.failure().kind, path + QStringLiteral(": ") + content.failure().message};
+        return Failure{content.failure().kind, path + u": "_s + content.failure().message};
     return content;
 }
 
@@ -116,35 +118,30 @@ int check(const QStringList& folders, PrintFileShape shape) {
 
 int main(int argc, char** argv) {
     QCoreApplication application(argc, argv);
-    QCoreApplication::setApplicationName(QStringLiteral("lumora-jpp"));
+    QCoreApplication::setApplicationName(u"lumora-jpp"_s);
     QCoreApplication::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
 
     QCommandLineParser parser;
-    parser.setApplicationDescription(
-        QStringLiteral("Reads print files.\n\n"
-                       "  lumora-jpp info FILE...            what print files hold\n"
-                       "  lumora-jpp unpack FILE OUT.jpg     the picture of a print file\n"
-                       "  lumora-jpp check ORDER_FOLDER...   whether an order is whole\n\n"
-                       "Exit status: 0 all is well, 1 a file or an order is at fault, 2 the call is."));
+    parser.setApplicationDescription(u"Reads print files.\n\n"
+                                     u"  lumora-jpp info FILE...            what print files hold\n"
+                                     u"  lumora-jpp unpack FILE OUT.jpg     the picture of a print file\n"
+                                     u"  lumora-jpp check ORDER_FOLDER...   whether an order is whole\n\n"
+                                     u"Exit status: 0 all is well, 1 a file or an order is at fault, 2 the call is."_s);
     parser.addHelpOption();
     parser.addVersionOption();
-    const QCommandLineOption base(QStringLiteral("base"),
-                                  QStringLiteral("What the profile adds to the length of a piece (30)."),
-                                  QStringLiteral("NUMBER"), QStringLiteral("30"));
-    const QCommandLineOption chunks(QStringLiteral("chunks"),
-                                    QStringLiteral("Pieces of a print file, 1 to 32767 (56)."),
-                                    QStringLiteral("NUMBER"), QStringLiteral("56"));
+    const QCommandLineOption base(u"base"_s, u"What the profile adds to the length of a piece (30)."_s, u"NUMBER"_s,
+                                  u"30"_s);
+    const QCommandLineOption chunks(u"chunks"_s, u"Pieces of a print file, 1 to 32767 (56)."_s, u"NUMBER"_s, u"56"_s);
     parser.addOptions({base, chunks});
-    parser.addPositionalArgument(QStringLiteral("command"), QStringLiteral("info, unpack or check"));
-    parser.addPositionalArgument(QStringLiteral("arguments"), QStringLiteral("as above"),
-                                 QStringLiteral("ARGUMENT..."));
+    parser.addPositionalArgument(u"command"_s, u"info, unpack or check"_s);
+    parser.addPositionalArgument(u"arguments"_s, u"as above"_s, u"ARGUMENT..."_s);
     if (!parser.parse(QCoreApplication::arguments())) {
         err() << parser.errorText() << Qt::endl;
         return notUnderstood;
     }
-    if (parser.isSet(QStringLiteral("version")))
+    if (parser.isSet(u"version"_s))
         parser.showVersion();
-    if (parser.isSet(QStringLiteral("help")))
+    if (parser.isSet(u"help"_s))
         parser.showHelp();
 
     bool baseOk = false;

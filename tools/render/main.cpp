@@ -21,6 +21,8 @@
 #include <string_view>
 #include <vector>
 
+using namespace Qt::StringLiterals;
+
 using namespace lumora;
 namespace fs = std::filesystem;
 
@@ -186,8 +188,7 @@ Result<QByteArray> pngOf(const Bitmap& picture, const fs::path& source) {
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
     if (!onWhite(picture).image().save(&buffer, "PNG"))
-        return Failure{Failure::Kind::Other,
-                       QString::fromStdString(source.string()) + QStringLiteral(": can't be made a PNG")};
+        return Failure{Failure::Kind::Other, QString::fromStdString(source.string()) + u": can't be made a PNG"_s};
     return bytes;
 }
 

@@ -6,8 +6,10 @@
 
 namespace lumora::CaptionStep {
 
+using namespace Qt::StringLiterals;
+
 void begin(EditFields& edit) {
-    edit.TextFont = QStringLiteral("David");
+    edit.TextFont = u"David"_s;
     edit.TextFontSize = 24;
     colour(edit, qRgb(255, 255, 30));
     edit.TextX = 100;

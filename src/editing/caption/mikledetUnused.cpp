@@ -3,9 +3,11 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void mikledet::Command10_Click() {
     Combo1List.clear();
-    Combo1List.append(QStringLiteral("David"));
+    Combo1List.append(u"David"_s);
     chooseFont(0);
 }
 

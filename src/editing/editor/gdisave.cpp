@@ -16,6 +16,9 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int genericError = 1;
@@ -78,7 +81,7 @@ void gdisave::load() {
     const int status = m_start ? m_start() : 0;
     ShowGdiStatus(status);
     if (status != 0)
-        m_platform.dialogs.message(QStringLiteral("GDI+ not inizialized."), QStringLiteral("GDI Error"));
+        m_platform.dialogs.message(u"GDI+ not inizialized."_s, u"GDI Error"_s);
     GdiReady = status == 0;
     setTexts();
 }
@@ -105,9 +108,9 @@ void gdisave::saveOrderSheet(const Bitmap& picture) {
         SaveJpeg(PicPic, OrderFolder::chosen(m_state).filePath(name), 90);
     };
     if (m_state.transfer.SugSheliach == Sender::Ftp)
-        save(QStringLiteral(".jpp"));
+        save(u".jpp"_s);
     if (m_state.transfer.SugSheliach == Sender::Http || m_state.TachanaMekomit)
-        save(QStringLiteral(".jpg"));
+        save(u".jpg"_s);
 }
 
 void gdisave::saveProof(const Bitmap& picture) {
@@ -121,9 +124,8 @@ bool gdisave::SaveJpeg(const Bitmap& picture, const DrivePath& path, int quality
         ShowGdiStatus(2, path.text());
         return false;
     }
-    if (!FindEncoderClsid(QStringLiteral("image/jpeg"))) {
-        m_platform.dialogs.message(QStringLiteral("Konnte keinen passenden Encoder ermitteln."),
-                                   QStringLiteral("Encoder Error"));
+    if (!FindEncoderClsid(u"image/jpeg"_s)) {
+        m_platform.dialogs.message(u"Konnte keinen passenden Encoder ermitteln."_s, u"Encoder Error"_s);
         return false;
     }
     const Result<QByteArray> jpeg = encodeJpeg(picture, std::clamp(quality, HScroll1Min, HScroll1Max));
@@ -140,16 +142,16 @@ void gdisave::showFailure(const Failure& failure) {
 int gdisave::ShowGdiStatus(int status, const QString& detail) {
     if (status == 0)
         return status;
-    QString text = GdiStatusText(status) + QStringLiteral(" GDI+ Error:") + QString::number(status);
+    QString text = GdiStatusText(status) + u" GDI+ Error:"_s + QString::number(status);
     if (!detail.isEmpty())
         text += u'\n' + detail;
-    m_platform.dialogs.message(text, QStringLiteral("GDI Error"));
+    m_platform.dialogs.message(text, u"GDI Error"_s);
     return status;
 }
 
 QString gdisave::GdiStatusText(int status) {
     if (status < 1 || status >= static_cast<int>(statusTexts.size()))
-        return QStringLiteral("Unknown GDI+ Error.");
+        return u"Unknown GDI+ Error."_s;
     return QString::fromLatin1(statusTexts[static_cast<std::size_t>(status)]);
 }
 

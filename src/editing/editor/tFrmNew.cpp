@@ -19,6 +19,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::tFrmNew)
     , m_state(state)
@@ -136,9 +138,8 @@ bool tFrmNew::loadPictureOfRecord() {
     m_edit.RedMarker = EditRecord::notMarked;
     if (!LoadWorkBitmap(m_edit.PicturePath))
         return false;
-    tell(QStringLiteral("תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"),
-         QStringLiteral("The red-eye correction of this picture was lost. It is shown and printed without it"),
-         copy.text());
+    tell(u"תיקון העיניים האדומות של תמונה זו אבד. התמונה תוצג ותודפס בלעדיו"_s,
+         u"The red-eye correction of this picture was lost. It is shown and printed without it"_s, copy.text());
     return true;
 }
 
@@ -147,8 +148,8 @@ bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
     Result<EditedPreview> opened =
         EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
-        tell(QStringLiteral("לא ניתן לפתוח את התמונה לעריכה"),
-             QStringLiteral("The picture can't be opened for editing"), opened.failure().message);
+        tell(u"לא ניתן לפתוח את התמונה לעריכה"_s, u"The picture can't be opened for editing"_s,
+             opened.failure().message);
         return false;
     }
     surfaces().open(std::move(*opened));
@@ -172,11 +173,11 @@ void tFrmNew::writeWorkFile() {
 void tFrmNew::pickAnotherPicture() {
     stopHolds();
     const DrivePath picture = m_platform.dialogs.pickFile(
-        m_state.wording(QStringLiteral("לחץ על תמונה אחת פעמיים וכל התמונות מהתיקייה תוצגנה "),
-                        QStringLiteral("Double-click one picture and all the pictures of the folder will be shown")),
+        m_state.wording(u"לחץ על תמונה אחת פעמיים וכל התמונות מהתיקייה תוצגנה "_s,
+                        u"Double-click one picture and all the pictures of the folder will be shown"_s),
         m_state.DiskRoot,
-        m_state.wording(QStringLiteral("בחר תמונה אחת וכל התמונות תוצגנה"),
-                        QStringLiteral("Choose one picture and all the pictures will be shown")));
+        m_state.wording(u"בחר תמונה אחת וכל התמונות תוצגנה"_s,
+                        u"Choose one picture and all the pictures will be shown"_s));
     if (picture.isEmpty())
         return;
     backToPictures();

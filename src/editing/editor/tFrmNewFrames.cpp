@@ -8,6 +8,9 @@
 #include "session/Workspace.h"
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int framePictureSize = 160;
@@ -41,7 +44,7 @@ void tFrmNew::chooseFrame(int index) {
     if (Combo2List.currentIndex() < 0)
         return;
     Combo2.text = Combo2List.currentItem();
-    Label6.text = QString::number(index + 1) + QStringLiteral("  / ");
+    Label6.text = QString::number(index + 1) + u"  / "_s;
     Q_EMIT changed();
     if (!m_open || Combo4.text.isEmpty())
         return;

@@ -4,6 +4,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void tFrmNew::setTexts() {
     setCaptions(
         m_state,
@@ -90,10 +92,10 @@ QString tFrmNew::hintLine(const Caption& button) {
     if (const qsizetype held = hint.indexOf(u'='); held >= 0) {
         QString press = hint.mid(held);
         press.remove(u'=');
-        hint = hint.left(held).trimmed() + QStringLiteral(" (") + press.simplified() + u')';
+        hint = hint.left(held).trimmed() + u" ("_s + press.simplified() + u')';
     }
     const QString name = button.text.simplified();
-    return hint.isEmpty() || hint == name ? name : name + QStringLiteral(": ") + hint;
+    return hint.isEmpty() || hint == name ? name : name + u": "_s + hint;
 }
 
 } // namespace lumora

@@ -6,6 +6,9 @@
 #include <cmath>
 
 namespace lumora::RedEye {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 bool inside(const Bitmap& picture, int x, int y) {
@@ -66,7 +69,7 @@ QStringList correct(Bitmap& picture, QRect square, double ratio, int level) {
             const QRgb pixel = picture.image().pixel(atX, atY);
             if (threshold < redness(pixel) - brightness(pixel)) {
                 picture.image().setPixel(atX, atY, greyOf(pixel));
-                changed += QStringLiteral("%1^%2").arg(x).arg(y);
+                changed += u"%1^%2"_s.arg(x).arg(y);
             }
         }
     }

@@ -7,6 +7,9 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The channels in the order of the file.
@@ -17,7 +20,7 @@ auto channels(Minimums& minimums) {
 }
 
 QString keyOf(char16_t channel, std::size_t index) {
-    return QStringLiteral("TKN.A_%1_MIN(%2)").arg(QChar(channel)).arg(index + 1);
+    return u"TKN.A_%1_MIN(%2)"_s.arg(QChar(channel)).arg(index + 1);
 }
 
 } // namespace
@@ -41,7 +44,7 @@ Result<void> ChannelMinimums::readFrom(const Files& files, const DrivePath& path
 
 Result<void> ChannelMinimums::writeTo(const Files& files, const DrivePath& path) const {
     ListOutput out;
-    out.pair(QStringLiteral("00"), QStringLiteral("00"));
+    out.pair(u"00"_s, u"00"_s);
     for (const auto& [channel, values] : channels(*this)) {
         for (std::size_t i = 0; i < values->size(); ++i)
             out.text(keyOf(channel, i)).single((*values)[i]).endLine();

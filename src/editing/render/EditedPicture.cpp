@@ -13,6 +13,9 @@
 #include <cmath>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -83,8 +86,8 @@ bool touches(const Placement& placement, PictureSize paper) {
 
 // True for a plain name that can't lead out of the folder.
 bool isPlainName(const QString& name) {
-    return !name.contains(u'/') && !name.contains(u'\\') && !name.contains(u':') &&
-           !name.contains(QStringLiteral("..")) && !name.contains(QChar(0)) && name != QStringLiteral(".");
+    return !name.contains(u'/') && !name.contains(u'\\') && !name.contains(u':') && !name.contains(u".."_s) &&
+           !name.contains(QChar(0)) && name != u"."_s;
 }
 
 // Frame files are found whatever their letter case.
@@ -117,9 +120,8 @@ Result<Bitmap> loadWork(const fs::path& file, PictureSize fileSize, PictureSize 
 }
 
 Failure noRoom(const fs::path& file, PictureSize size) {
-    return {
-        Failure::Kind::TooLarge,
-        QStringLiteral("%1: no memory for a picture of %2 x %3").arg(toText(file)).arg(size.width).arg(size.height)};
+    return {Failure::Kind::TooLarge,
+            u"%1: no memory for a picture of %2 x %3"_s.arg(toText(file)).arg(size.width).arg(size.height)};
 }
 
 Result<Bitmap> loadGreyPart(const EditedPrint& print, PictureSize wanted, const QRect& part) {
@@ -141,7 +143,7 @@ std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& 
         !isPlainName(name) || !isPlainName(folder))
         return std::nullopt;
     const auto load = [&](const QString& leaf) -> std::optional<Bitmap> {
-        auto frame = loadPicture(fileNamed(framesFolder / toHostPath(folder), leaf + QStringLiteral(".bmp")));
+        auto frame = loadPicture(fileNamed(framesFolder / toHostPath(folder), leaf + u".bmp"_s));
         return frame ? std::optional(*frame) : std::nullopt;
     };
     if (use == FrameUse::Print) {
@@ -158,8 +160,7 @@ Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperSize paper,
         return size.failure();
     const auto workSize = workPictureSize(*size, zoomPercent);
     if (!workSize)
-        return Failure{Failure::Kind::TooLarge, QStringLiteral("%1: a picture of %2 x %3 is too slim to be edited")
-                                                    .arg(toText(file))
+        return Failure{Failure::Kind::TooLarge, u"%1: a picture of %2 x %3 is too slim to be edited"_s.arg(toText(file))
                                                     .arg(size->width)
                                                     .arg(size->height)};
     const PictureSize most = scaledSize(*workSize, largestScale);

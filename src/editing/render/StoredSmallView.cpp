@@ -8,6 +8,8 @@
 
 namespace lumora::StoredSmallView {
 
+using namespace Qt::StringLiterals;
+
 DrivePath path(const SessionState& state, const DrivePath& picturePath) {
     return WorkspacePaths::ktanim(state) / MangleFileName(picturePath);
 }
@@ -22,8 +24,7 @@ Result<void> store(const SessionState& state, const Files& files, const DrivePat
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
     if (!preview.image().save(&buffer, "BMP"))
-        return Failure{Failure::Kind::Other,
-                       QStringLiteral("The small view of %1 can't be made.").arg(picturePath.text())};
+        return Failure{Failure::Kind::Other, u"The small view of %1 can't be made."_s.arg(picturePath.text())};
     return files.writeWhole(path(state, picturePath), bytes);
 }
 

@@ -5,6 +5,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr struct {
@@ -49,8 +51,8 @@ QString MailResultText(int code, bool english) {
     }
     if (std::find(std::begin(wordless), std::end(wordless), code) != std::end(wordless))
         return {};
-    return english ? QStringLiteral("An unclear fault kept the file from being sent.")
-                   : QStringLiteral("תקלה לא ברורה אבל בכל זאת מנעה משלוח של הקובץ");
+    return english ? u"An unclear fault kept the file from being sent."_s
+                   : u"תקלה לא ברורה אבל בכל זאת מנעה משלוח של הקובץ"_s;
 }
 
 int MailResultCode(MailEnd end) {

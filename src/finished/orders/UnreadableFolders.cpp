@@ -5,11 +5,12 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void TellUnreadableFolders(const SessionState& state, Dialogs& dialogs, const QStringList& unreadable) {
     if (!unreadable.isEmpty())
-        dialogs.message(
-            state.wording(QStringLiteral("אין אפשרות לקרוא תיקייה זו:"), QStringLiteral("This folder can't be read:")) +
-            u'\n' + unreadable.join(u'\n'));
+        dialogs.message(state.wording(u"אין אפשרות לקרוא תיקייה זו:"_s, u"This folder can't be read:"_s) + u'\n' +
+                        unreadable.join(u'\n'));
 }
 
 } // namespace lumora

@@ -12,13 +12,15 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-const QString meforakim = QStringLiteral("meforakim");
-const QString moorkavim = QStringLiteral("moorkavim");
+const QString meforakim = u"meforakim"_s;
+const QString moorkavim = u"moorkavim"_s;
 
 Failure fault(Failure::Kind kind, const QString& path, const QString& reason) {
-    return {kind, QStringLiteral("%1: %2").arg(path, reason)};
+    return {kind, u"%1: %2"_s.arg(path, reason)};
 }
 
 DrivePath beside(const DrivePath& piece, int sequence) {
@@ -47,27 +49,23 @@ Cut Mod4split::SplitFile(const DrivePath& path, const QString& segmentText, Targ
     };
     const auto segment = SegmentSize(segmentText);
     if (!segment)
-        return refuse(
-            fault(Failure::Kind::Unsupported, segmentText, QStringLiteral("no number of bytes from 1 to 2147483647")));
+        return refuse(fault(Failure::Kind::Unsupported, segmentText, u"no number of bytes from 1 to 2147483647"_s));
     const auto length = m_files.size(path);
     if (!length)
         return refuse(length.failure());
     const qint64 declared = *length / *segment + 1;
     // A piece's name has three digits for a number: more pieces could never be joined.
     if (declared > mostPieces)
-        return refuse(fault(Failure::Kind::TooLarge, path.text(),
-                            QStringLiteral("%1 pieces of %2 bytes; names have room for %3")
-                                .arg(declared)
-                                .arg(*segment)
-                                .arg(mostPieces)));
+        return refuse(
+            fault(Failure::Kind::TooLarge, path.text(),
+                  u"%1 pieces of %2 bytes; names have room for %3"_s.arg(declared).arg(*segment).arg(mostPieces)));
     cut.declared = static_cast<int>(declared);
     const QString total = PieceNumber(cut.declared);
     const QString stem = PieceStem(path.leaf());
     const QString longest = stem + PieceTail(1, total);
     // A name that the drive shortens would lose the numbers at its end.
     if (ShortenedName(longest) != longest)
-        return refuse(
-            fault(Failure::Kind::Unsupported, path.text(), QStringLiteral("the name is too long for pieces")));
+        return refuse(fault(Failure::Kind::Unsupported, path.text(), u"the name is too long for pieces"_s));
 
     const auto host = m_files.host(path);
     if (!host)
@@ -105,7 +103,7 @@ Result<void> Mod4split::writePiece(const DrivePath& path, const Descriptor& sour
     if (!taken)
         return taken.failure();
     if (!content.failed() && *taken != count)
-        return fault(Failure::Kind::Damaged, sourcePath.text(), QStringLiteral("the file became shorter meanwhile"));
+        return fault(Failure::Kind::Damaged, sourcePath.text(), u"the file became shorter meanwhile"_s);
     if (m_files.fileExists(path)) {
         const auto old = openSource(*host, path.text());
         if (!old)
@@ -129,7 +127,7 @@ Joined Mod4split::MergeFamily(const DrivePath& piecePath) const {
     const auto name = JoinedName(piecePath.leaf());
     if (!name)
         return refuse(fault(Failure::Kind::Unsupported, piecePath.text(),
-                            QStringLiteral("no piece: the name is shorter than a name and \"_001_001.prk\"")));
+                            u"no piece: the name is shorter than a name and \"_001_001.prk\""_s));
     const DrivePath folder = piecePath.parent() / moorkavim;
     // A family whose pieces were removed meanwhile must not leave an empty folder.
     if (m_files.fileExists(beside(piecePath, 1))) {
@@ -158,8 +156,7 @@ Result<qint64> Mod4split::appendPieces(const DrivePath& piecePath, const DrivePa
     while (count < mostPieces && m_files.fileExists(beside(piecePath, count + 1)))
         ++count;
     if (count == 0)
-        return fault(Failure::Kind::NotFound, beside(piecePath, 1).text(),
-                     QStringLiteral("the first piece is not there"));
+        return fault(Failure::Kind::NotFound, beside(piecePath, 1).text(), u"the first piece is not there"_s);
     const auto target = m_files.host(outputPath);
     if (!target)
         return target.failure();

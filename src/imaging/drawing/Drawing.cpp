@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 Bitmap turned(const Bitmap& picture, QuarterTurn turn) {
     if (turn == QuarterTurn::None)
         return picture;
@@ -17,7 +19,7 @@ Bitmap turned(const Bitmap& picture, QuarterTurn turn) {
 }
 
 QString installedFamily(const QString& family) {
-    const QString known = family == QStringLiteral("David") ? QStringLiteral("David CLM") : family;
+    const QString known = family == u"David"_s ? u"David CLM"_s : family;
     return QFontDatabase::hasFamily(known) ? known : QString();
 }
 

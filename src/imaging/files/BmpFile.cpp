@@ -12,6 +12,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr qint64 headerSize = 14 + 40;
@@ -103,9 +105,9 @@ Result<BmpRows> BmpRows::open(const std::filesystem::path& path, QSize picture) 
     Descriptor file(::open(path.c_str(), O_RDWR | O_CLOEXEC));
     struct stat status {};
     if (!file.valid() || ::fstat(file.number(), &status) != 0)
-        return fileFailure(path, QStringLiteral("can't be opened"), errno);
+        return fileFailure(path, u"can't be opened"_s, errno);
     if (status.st_size != fileSize(picture))
-        return fileFailure(path, QStringLiteral("is not the copy of this picture"), EINVAL);
+        return fileFailure(path, u"is not the copy of this picture"_s, EINVAL);
     return BmpRows(path, std::move(file), picture);
 }
 
@@ -128,7 +130,7 @@ Result<void> BmpRows::write(const Bitmap& picture, const QRect& part) {
         packRow(rowOf(picture, y) + part.left(), part.width(), row.data());
         const qint64 at = placeOf(m_picture, part.left(), y);
         if (::pwrite(m_file.number(), row.constData(), static_cast<std::size_t>(row.size()), at) != row.size())
-            return fileFailure(m_path, QStringLiteral("can't be written"), errno);
+            return fileFailure(m_path, u"can't be written"_s, errno);
     }
     return {};
 }
@@ -139,7 +141,7 @@ Result<Bitmap> BmpRows::read(const QRect& part) const {
     for (int y = 0; y < part.height(); ++y) {
         const qint64 at = placeOf(m_picture, part.left(), part.top() + y);
         if (::pread(m_file.number(), row.data(), static_cast<std::size_t>(row.size()), at) != row.size())
-            return fileFailure(m_path, QStringLiteral("can't be read"), errno);
+            return fileFailure(m_path, u"can't be read"_s, errno);
         auto* to = reinterpret_cast<QRgb*>(result.image().scanLine(y));
         const auto* from = reinterpret_cast<const uchar*>(row.constData());
         for (int x = 0; x < part.width(); ++x, from += pixelSize)

@@ -13,6 +13,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // A hostile progressive file may have thousands of scans, each over the whole picture; real files have about ten.
@@ -89,12 +91,12 @@ struct JpegReader::State {
 
     Failure failure() const {
         if (source.readError != 0)
-            return fileFailure(input.path(), QStringLiteral("can't be read"), source.readError);
+            return fileFailure(input.path(), u"can't be read"_s, source.readError);
         if (errors.outOfMemory)
-            return pictureFailure(input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+            return pictureFailure(input.path(), Failure::Kind::TooLarge, u"memory is short"_s);
         switch (errors.code) {
         case JERR_IMAGE_TOO_BIG:
-            return pictureFailure(input.path(), Failure::Kind::TooLarge, QStringLiteral("the picture is too large"));
+            return pictureFailure(input.path(), Failure::Kind::TooLarge, u"the picture is too large"_s);
         case JERR_SOF_UNSUPPORTED:
         case JERR_BAD_PRECISION:
         case JERR_CONVERSION_NOTIMPL:
@@ -102,10 +104,10 @@ struct JpegReader::State {
         case JERR_NOT_COMPILED:
         case JERR_ARITH_NOTIMPL:
             return pictureFailure(input.path(), Failure::Kind::Unsupported,
-                                  QStringLiteral("a kind of JPEG file that can't be shown (%1)").arg(errors.text));
+                                  u"a kind of JPEG file that can't be shown (%1)"_s.arg(errors.text));
         default:
             return pictureFailure(input.path(), Failure::Kind::Damaged,
-                                  QStringLiteral("the picture is damaged or cut short (%1)").arg(errors.text));
+                                  u"the picture is damaged or cut short (%1)"_s.arg(errors.text));
         }
     }
 
@@ -172,7 +174,7 @@ Result<std::unique_ptr<JpegReader>> JpegReader::open(PictureInput input) {
     // refused before memory is taken. Arithmetic coding has no such bound.
     if (s.info.arith_code == FALSE && width * height / 64 / 8 > s.input.size())
         return pictureFailure(s.input.path(), Failure::Kind::Damaged,
-                              QStringLiteral("the file is too short for %1 x %2 pixels").arg(width).arg(height));
+                              u"the file is too short for %1 x %2 pixels"_s.arg(width).arg(height));
     return std::unique_ptr<JpegReader>(new JpegReader(std::move(state)));
 }
 
@@ -186,7 +188,7 @@ Result<Bitmap> JpegReader::readBitmap(int denominator) {
         return s.failure();
     QImage image(static_cast<int>(s.info.output_width), static_cast<int>(s.info.output_height), QImage::Format_RGB32);
     if (image.isNull())
-        return pictureFailure(s.input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+        return pictureFailure(s.input.path(), Failure::Kind::TooLarge, u"memory is short"_s);
     std::vector<unsigned char> inks(s.inks() ? static_cast<std::size_t>(image.width()) * 4 : 0);
     for (int y = 0; y < image.height(); ++y) {
         if (!s.readLine(image.scanLine(y), inks))

@@ -6,6 +6,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 struct JpegWriter::State {
     State() {
         target.init_destination = [](j_compress_ptr) {};
@@ -87,13 +89,13 @@ Result<QByteArray> JpegWriter::finish() {
     State& s = *m_state;
     s.run([&s] { jpeg_finish_compress(&s.info); });
     if (!s.ok)
-        return Failure{Failure::Kind::Other, QStringLiteral("JPEG writer: ") + s.errors.text};
+        return Failure{Failure::Kind::Other, u"JPEG writer: "_s + s.errors.text};
     return std::move(s.bytes);
 }
 
 Result<QByteArray> writeJpeg(const Bitmap& picture, int quality) {
     if (picture.isNull())
-        return Failure{Failure::Kind::Other, QStringLiteral("JPEG writer: the picture has no pixels")};
+        return Failure{Failure::Kind::Other, u"JPEG writer: the picture has no pixels"_s};
     const QImage image = onWhite(picture).image();
     JpegWriter writer({image.width(), image.height()}, quality, JpegWriter::Input::Pixels);
     for (int y = 0; y < image.height(); ++y)

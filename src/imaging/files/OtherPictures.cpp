@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 Result<QByteArray> readAll(const PictureInput& input) {
@@ -19,7 +21,7 @@ Result<QByteArray> readAll(const PictureInput& input) {
     while (filled < bytes.size()) {
         const std::ptrdiff_t got = input.read(bytes.data() + filled, static_cast<std::size_t>(bytes.size() - filled));
         if (got < 0)
-            return fileFailure(input.path(), QStringLiteral("can't be read"), errno);
+            return fileFailure(input.path(), u"can't be read"_s, errno);
         if (got == 0)
             break;
         filled += got;
@@ -37,7 +39,7 @@ Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
     if (oldHeader)
         return {};
     const auto cutShort = [&] {
-        return pictureFailure(input.path(), Failure::Kind::Damaged, QStringLiteral("the picture is cut short"));
+        return pictureFailure(input.path(), Failure::Kind::Damaged, u"the picture is cut short"_s);
     };
     if (bytes.size() < headers)
         return cutShort();
@@ -75,8 +77,7 @@ Result<Value> withReader(const PictureInput& input, const Use& use) {
     reader.setAutoTransform(false);
     const QSize size = reader.size();
     if (!size.isValid())
-        return pictureFailure(input.path(), Failure::Kind::Damaged,
-                              QStringLiteral("the picture is damaged or cut short"));
+        return pictureFailure(input.path(), Failure::Kind::Damaged, u"the picture is damaged or cut short"_s);
     if (auto bounds = checkPictureBounds(input.path(), size.width(), size.height()); !bounds)
         return bounds.failure();
     return use(reader);
@@ -94,11 +95,10 @@ Result<Bitmap> readOtherPicture(const PictureInput& input) {
     return withReader<Bitmap>(input, [&input](QImageReader& reader) -> Result<Bitmap> {
         QImage image = reader.read();
         if (image.isNull())
-            return pictureFailure(input.path(), Failure::Kind::Damaged,
-                                  QStringLiteral("the picture is damaged or cut short"));
+            return pictureFailure(input.path(), Failure::Kind::Damaged, u"the picture is damaged or cut short"_s);
         image.convertTo(image.hasAlphaChannel() ? QImage::Format_ARGB32_Premultiplied : QImage::Format_RGB32);
         if (image.isNull())
-            return pictureFailure(input.path(), Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+            return pictureFailure(input.path(), Failure::Kind::TooLarge, u"memory is short"_s);
         return Bitmap(std::move(image));
     });
 }

@@ -18,10 +18,12 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 Failure memoryIsShort(const std::filesystem::path& path) {
-    return pictureFailure(path, Failure::Kind::TooLarge, QStringLiteral("memory is short"));
+    return pictureFailure(path, Failure::Kind::TooLarge, u"memory is short"_s);
 }
 
 struct Wanted {

@@ -13,28 +13,30 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr std::int64_t maxSide = 65500;
 constexpr std::int64_t maxPixels = 250'000'000;
 
 QString cannotBeRead() {
-    return QStringLiteral("can't be read");
+    return u"can't be read"_s;
 }
 
 } // namespace
 
 Failure pictureFailure(const std::filesystem::path& path, Failure::Kind kind, const QString& reason) {
     const std::string name = path.string();
-    return {kind, QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())) + QStringLiteral(": ") + reason};
+    return {kind, QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())) + u": "_s + reason};
 }
 
 Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t width, std::int64_t height) {
     if (width < 1 || height < 1)
-        return pictureFailure(path, Failure::Kind::Damaged, QStringLiteral("the picture has no pixels"));
+        return pictureFailure(path, Failure::Kind::Damaged, u"the picture has no pixels"_s);
     if (width > maxSide || height > maxSide || width * height > maxPixels) {
         return pictureFailure(path, Failure::Kind::TooLarge,
-                              QStringLiteral("the picture is too large, %1 x %2 pixels").arg(width).arg(height));
+                              u"the picture is too large, %1 x %2 pixels"_s.arg(width).arg(height));
     }
     return {};
 }
@@ -48,7 +50,7 @@ Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
     if (input.m_file < 0 || ::fstat(input.m_file, &status) != 0)
         return fileFailure(path, cannotBeRead(), errno);
     if (!S_ISREG(status.st_mode))
-        return pictureFailure(path, Failure::Kind::Unsupported, QStringLiteral("is not a file"));
+        return pictureFailure(path, Failure::Kind::Unsupported, u"is not a file"_s);
     input.m_size = status.st_size;
 
     std::array<unsigned char, 8> head{};
@@ -56,7 +58,7 @@ Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
     if (got < 0)
         return fileFailure(path, cannotBeRead(), errno);
     if (got == 0)
-        return pictureFailure(path, Failure::Kind::Damaged, QStringLiteral("the file is empty"));
+        return pictureFailure(path, Failure::Kind::Damaged, u"the file is empty"_s);
     if (got >= 3 && std::memcmp(head.data(), "\xFF\xD8\xFF", 3) == 0)
         input.m_format = Format::Jpeg;
     else if (got >= 2 && std::memcmp(head.data(), "BM", 2) == 0)
@@ -64,7 +66,7 @@ Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
     else if (got >= 8 && std::memcmp(head.data(), "\x89PNG\r\n\x1A\n", 8) == 0)
         input.m_format = Format::Png;
     else
-        return pictureFailure(path, Failure::Kind::Unsupported, QStringLiteral("is no picture of a known kind"));
+        return pictureFailure(path, Failure::Kind::Unsupported, u"is no picture of a known kind"_s);
     return input;
 }
 

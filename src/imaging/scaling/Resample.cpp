@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 QRect wholeOf(PictureSize size) {
@@ -237,7 +239,7 @@ Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRe
     }
     Bitmap target(QImage(part.size(), QImage::Format_RGB32));
     if (target.isNull())
-        return Failure{Failure::Kind::TooLarge, QStringLiteral("memory is short")};
+        return Failure{Failure::Kind::TooLarge, u"memory is short"_s};
     BitmapTaker taker(reader.size(), size, part, target, kernels);
     if (auto read = reader.readPlanes(denominator, taker); !read)
         return read.failure();

@@ -12,6 +12,8 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 namespace {
 
@@ -90,7 +92,7 @@ HostPath Drives::defaultDataFolder() {
 }
 
 DrivePath Drives::programRoot() const {
-    return DrivePath(QString(m_programLetter) + QStringLiteral(":\\"));
+    return DrivePath(QString(m_programLetter) + u":\\"_s);
 }
 
 void Drives::refreshMedia() {
@@ -143,7 +145,7 @@ std::vector<Drives::Drive> Drives::drives() const {
             add(letter, folder, toText(folder.filename()), true);
     }
     if (m_programLetter != rootLetter)
-        add(rootLetter, "/", QStringLiteral("/"), false);
+        add(rootLetter, "/", u"/"_s, false);
     const auto place = [&](const Drive& drive) {
         return drive.offeredFirst ? m_offeredFirst.indexOf(drive.letter) : m_offeredFirst.size();
     };
@@ -199,7 +201,7 @@ DrivePath Drives::toDrive(const HostPath& hostPath) const {
             names = std::move(*inside);
         }
     }
-    DrivePath drivePath(QString(letter) + QStringLiteral(":\\"));
+    DrivePath drivePath(QString(letter) + u":\\"_s);
     for (const HostPath& name : names)
         drivePath = drivePath / toDriveName(name);
     return drivePath;

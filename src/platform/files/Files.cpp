@@ -10,6 +10,8 @@
 #include <cerrno>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 namespace {
 
@@ -17,7 +19,7 @@ namespace {
 constexpr qint64 largestRead = qint64(1) << 30;
 
 Failure failure(Failure::Kind kind, const DrivePath& path, const QString& reason) {
-    return {kind, QStringLiteral("%1: %2").arg(path.text(), reason)};
+    return {kind, u"%1: %2"_s.arg(path.text(), reason)};
 }
 
 // In a pattern "*" stands for any characters, "?" for one.
@@ -109,10 +111,10 @@ Result<void> write(const Result<HostPath>& host, const DrivePath& path, const QB
 
 Result<HostPath> Files::host(const DrivePath& path) const {
     if (path.text().contains(u'?'))
-        return failure(Failure::Kind::NotFound, path, QStringLiteral("the name holds a \"?\""));
+        return failure(Failure::Kind::NotFound, path, u"the name holds a \"?\""_s);
     if (auto found = m_drives.toHost(path))
         return *found;
-    return failure(Failure::Kind::NotFound, path, QStringLiteral("no such drive or path"));
+    return failure(Failure::Kind::NotFound, path, u"no such drive or path"_s);
 }
 
 bool Files::fileExists(const DrivePath& path) const {
@@ -196,7 +198,7 @@ Result<qint64> Files::size(const DrivePath& path) const {
     if (::stat(found->c_str(), &status) != 0)
         return systemFailure(errno, path.text());
     if (!S_ISREG(status.st_mode))
-        return failure(Failure::Kind::Unsupported, path, QStringLiteral("not a file"));
+        return failure(Failure::Kind::Unsupported, path, u"not a file"_s);
     return static_cast<qint64>(status.st_size);
 }
 

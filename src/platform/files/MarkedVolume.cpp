@@ -8,6 +8,9 @@
 #include <optional>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr qint64 largestMarkFile = 1 << 16; // bytes
@@ -34,9 +37,9 @@ std::optional<FolderMark> readMark(const HostPath& file) {
 
 bool keepMark(const HostPath& file, const FolderMark& mark) {
     ListOutput output;
-    output.text(QStringLiteral("Mark")).number(mark.number).endLine();
+    output.text(u"Mark"_s).number(mark.number).endLine();
     for (const QString& card : mark.cards)
-        output.pair(QStringLiteral("Card"), card);
+        output.pair(u"Card"_s, card);
     return writeWholeFile(file, output.bytes()).ok();
 }
 

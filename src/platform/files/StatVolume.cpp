@@ -7,6 +7,8 @@
 #include <cstring>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 namespace {
 
@@ -46,13 +48,13 @@ std::int32_t serialOfUuid(const QString& uuid) {
 Result<std::int32_t> StatVolume::serial(const DrivePath& driveRoot) const {
     const auto folder = m_drives.toHost(driveRoot);
     if (!folder)
-        return Failure{Failure::Kind::NotFound, QStringLiteral("%1: no such drive").arg(driveRoot.text())};
+        return Failure{Failure::Kind::NotFound, u"%1: no such drive"_s.arg(driveRoot.text())};
     const HostPath existing = nearestExisting(*folder);
     struct stat status {};
     struct statfs system {};
     if (::stat(existing.c_str(), &status) != 0 || ::statfs(existing.c_str(), &system) != 0)
         return Failure{Failure::Kind::Other,
-                       QStringLiteral("%1: %2").arg(driveRoot.text(), QString::fromLocal8Bit(std::strerror(errno)))};
+                       u"%1: %2"_s.arg(driveRoot.text(), QString::fromLocal8Bit(std::strerror(errno)))};
     if (const auto uuid = uuidOfDevice(m_uuidLinks, status.st_dev))
         return serialOfUuid(*uuid);
     static_assert(sizeof(system.f_fsid) == 2 * sizeof(std::uint32_t));

@@ -17,6 +17,9 @@
 #include <vector>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 using Poco::Net::SocketAddress;
@@ -38,9 +41,8 @@ bool completed(int code) {
 
 // The refusal speaks of encryption, which these servers ask for before anything else.
 bool asksForEncryption(const QByteArray& text) {
-    static const QRegularExpression words(
-        QStringLiteral("\\b(tls|ssl|ftps|encrypt\\w*|cleartext|plain ftp|use auth)\\b"),
-        QRegularExpression::CaseInsensitiveOption);
+    static const QRegularExpression words(u"\\b(tls|ssl|ftps|encrypt\\w*|cleartext|plain ftp|use auth)\\b"_s,
+                                          QRegularExpression::CaseInsensitiveOption);
     return words.match(QString::fromLatin1(text)).hasMatch();
 }
 
@@ -92,14 +94,13 @@ int passivePort(const QByteArray& text) {
 
 Failure FtpSessionWire::broken(Failure::Kind kind, const QString& reason) {
     close();
-    return {kind, QStringLiteral("ftp %1: %2").arg(m_host, reason)};
+    return {kind, u"ftp %1: %2"_s.arg(m_host, reason)};
 }
 
 Failure FtpSessionWire::refused(const Reply& reply) {
     if (reply.code == 421)
         close();
-    return {Failure::Kind::Refused,
-            QStringLiteral("ftp %1: %2").arg(m_host, AnsiCodePage::decode(reply.text).trimmed())};
+    return {Failure::Kind::Refused, u"ftp %1: %2"_s.arg(m_host, AnsiCodePage::decode(reply.text).trimmed())};
 }
 
 // Every call of the library may throw; nothing passes this point. After a failure of the line the dialogue is out of
@@ -109,7 +110,7 @@ auto FtpSessionWire::guarded(Step step) -> decltype(step()) {
     try {
         return step();
     } catch (const Poco::TimeoutException&) {
-        return broken(Failure::Kind::TimedOut, QStringLiteral("no answer within the time limit"));
+        return broken(Failure::Kind::TimedOut, u"no answer within the time limit"_s);
     } catch (const Poco::Exception& exception) {
         return broken(Failure::Kind::Disconnected, QString::fromStdString(exception.displayText()));
     } catch (const std::exception& exception) {
@@ -132,8 +133,7 @@ void FtpSessionWire::close() {
 Result<QByteArray> FtpSessionWire::argumentBytes(const QString& argument) const {
     const QByteArray bytes = AnsiCodePage::encode(argument);
     if (bytes.contains('\r') || bytes.contains('\n') || bytes.contains('\0'))
-        return Failure{Failure::Kind::Refused,
-                       QStringLiteral("ftp %1: a name with a line break was not sent").arg(m_host)};
+        return Failure{Failure::Kind::Refused, u"ftp %1: a name with a line break was not sent"_s.arg(m_host)};
     return bytes;
 }
 
@@ -227,7 +227,7 @@ Result<void> FtpSessionWire::login(const QString& user, const QString& password)
 Failure FtpSessionWire::refusedLogin(const Reply& reply) {
     Failure failure = refused(reply);
     if (asksForEncryption(reply.text))
-        failure = {Failure::Kind::Unsupported, QStringLiteral("this server wants encryption: ") + failure.message};
+        failure = {Failure::Kind::Unsupported, u"this server wants encryption: "_s + failure.message};
     return failure;
 }
 
@@ -268,7 +268,7 @@ Result<QString> FtpSessionWire::currentDirectory() {
         QString below = path->mid(m_home.size());
         if (!m_home.contains(u'/'))
             below.replace(u'\\', u'/');
-        return below.isEmpty() ? QStringLiteral("/") : below.startsWith(u'/') ? Result<QString>(below) : path;
+        return below.isEmpty() ? u"/"_s : below.startsWith(u'/') ? Result<QString>(below) : path;
     });
 }
 
@@ -362,10 +362,11 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
     try {
         moved = move(data.socket);
     } catch (const Poco::TimeoutException&) {
-        return broken(Failure::Kind::TimedOut, QStringLiteral("the transfer stood still"));
+        return broken(Failure::Kind::TimedOut, u"the transfer stood still"_s);
     } catch (const Poco::Exception& exception) {
-        moved = Failure{Failure::Kind::Disconnected, QStringLiteral("ftp %1: the transfer was cut: %2")
-                                                         .arg(m_host, QString::fromStdString(exception.displayText()))};
+        moved =
+            Failure{Failure::Kind::Disconnected,
+                    u"ftp %1: the transfer was cut: %2"_s.arg(m_host, QString::fromStdString(exception.displayText()))};
     }
     // Some servers wait for the end of a download's connection before they say that all has gone.
     if (!moved || direction == Direction::Down)
@@ -395,8 +396,7 @@ Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
     } catch (const Poco::TimeoutException&) {
         // The server keeps the data connection open although it has all bytes; that does no harm.
     } catch (const Poco::Exception&) {
-        return Failure{Failure::Kind::Disconnected,
-                       QStringLiteral("ftp %1: the transfer was cut at its end").arg(m_host)};
+        return Failure{Failure::Kind::Disconnected, u"ftp %1: the transfer was cut at its end"_s.arg(m_host)};
     }
     m_call.check();
     return {};
@@ -457,19 +457,19 @@ Result<FtpListing> FtpSessionWire::list(const QString& pattern, EmptyFolder empt
         return bytes.failure();
     QByteArray listing;
     const auto received = guarded([&] {
-        return transfer(*bytes == "*.*" ? QByteArray("LIST") : "LIST " + *bytes, Direction::Down,
-                        [&](StreamSocket& data) -> Result<void> {
-                            std::vector<char> part(chunk);
-                            for (;;) {
-                                const int count = data.receiveBytes(part.data(), static_cast<int>(part.size()));
-                                if (count <= 0)
-                                    return {};
-                                listing.append(part.data(), count);
-                                if (listing.size() > longestListing)
-                                    return Failure{Failure::Kind::TooLarge,
-                                                   QStringLiteral("ftp %1: a listing without an end").arg(m_host)};
-                            }
-                        });
+        return transfer(
+            *bytes == "*.*" ? QByteArray("LIST") : "LIST " + *bytes, Direction::Down,
+            [&](StreamSocket& data) -> Result<void> {
+                std::vector<char> part(chunk);
+                for (;;) {
+                    const int count = data.receiveBytes(part.data(), static_cast<int>(part.size()));
+                    if (count <= 0)
+                        return {};
+                    listing.append(part.data(), count);
+                    if (listing.size() > longestListing)
+                        return Failure{Failure::Kind::TooLarge, u"ftp %1: a listing without an end"_s.arg(m_host)};
+                }
+            });
     });
     const bool refusedAsEmpty =
         empty == EmptyFolder::MayBeRefused && listing.isEmpty() && (m_transferCode == 450 || m_transferCode == 550);

@@ -15,10 +15,13 @@
 #include <vector>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 Failure callFailure(Failure::Kind kind, const QString& url, const QString& reason) {
-    return {kind, QStringLiteral("%1: %2").arg(url, reason)};
+    return {kind, u"%1: %2"_s.arg(url, reason)};
 }
 
 constexpr qint64 pieceOfBody = 64 * 1024;
@@ -29,16 +32,16 @@ struct Address {
 };
 
 Result<Address> addressOf(const QString& url) {
-    const QString scheme = QStringLiteral("http://");
+    const QString scheme = u"http://"_s;
     if (!url.startsWith(scheme, Qt::CaseInsensitive))
-        return callFailure(Failure::Kind::Unsupported, url, QStringLiteral("only http addresses can be called"));
+        return callFailure(Failure::Kind::Unsupported, url, u"only http addresses can be called"_s);
     const QString rest = url.mid(scheme.size());
     qsizetype hostEnd = 0;
-    while (hostEnd < rest.size() && !QStringLiteral("/?#").contains(rest[hostEnd]))
+    while (hostEnd < rest.size() && !u"/?#"_s.contains(rest[hostEnd]))
         ++hostEnd;
     Address address{rest.left(hostEnd).toStdString(), HttpTarget(rest.mid(hostEnd))};
     if (address.host.empty())
-        return callFailure(Failure::Kind::Unsupported, url, QStringLiteral("the address names no host"));
+        return callFailure(Failure::Kind::Unsupported, url, u"the address names no host"_s);
     return address;
 }
 
@@ -66,19 +69,19 @@ bool isRedirect(int status) {
 
 QString hostAndPort(const std::string& host) {
     const QString text = QString::fromStdString(host).toLower();
-    return text.endsWith(QStringLiteral(":80")) ? text.chopped(3) : text;
+    return text.endsWith(u":80"_s) ? text.chopped(3) : text;
 }
 
 // Where a redirect leads on the same host and port; no value where it leads elsewhere.
 std::optional<QString> redirectTarget(const Address& from, const QString& location) {
-    const QString scheme = QStringLiteral("http://");
+    const QString scheme = u"http://"_s;
     const QString host = scheme + QString::fromStdString(from.host);
     QString url = location.left(location.indexOf(u'#'));
-    if (url.startsWith(QStringLiteral("//"))) {
-        url.prepend(QStringLiteral("http:"));
+    if (url.startsWith(u"//"_s)) {
+        url.prepend(u"http:"_s);
     } else if (url.startsWith(u'/')) {
         url.prepend(host);
-    } else if (!url.contains(QStringLiteral("://"))) {
+    } else if (!url.contains(u"://"_s)) {
         const qsizetype query = from.target.indexOf('?');
         const QByteArray path = query < 0 ? from.target : from.target.left(query);
         url = host + AnsiCodePage::decode(path.left(path.lastIndexOf('/') + 1)) + url;
@@ -121,7 +124,7 @@ Result<Answered> askOnce(const QString& url, const Address& to, const Asking& as
                 return answer;
             if (post)
                 return callFailure(Failure::Kind::Refused, url,
-                                   QStringLiteral("the server answered %1 and did not take it").arg(answer.status));
+                                   u"the server answered %1 and did not take it"_s.arg(answer.status));
         }
         std::vector<char> bytes(16 * 1024);
         std::streamsize received = 0;
@@ -129,16 +132,16 @@ Result<Answered> askOnce(const QString& url, const Address& to, const Asking& as
             body.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
             received += body.gcount();
             if (body.gcount() > 0 && !sink(bytes.data(), static_cast<std::size_t>(body.gcount())))
-                return callFailure(Failure::Kind::TooLarge, url, QStringLiteral("the answer could not be taken whole"));
+                return callFailure(Failure::Kind::TooLarge, url, u"the answer could not be taken whole"_s);
         }
         if (const Poco::Exception* lost = session.networkException())
             lost->rethrow();
         line.check();
         if (asking.method != Request::HTTP_HEAD && received < answer.length.value_or(received))
-            return callFailure(Failure::Kind::Disconnected, url, QStringLiteral("the answer was cut short"));
+            return callFailure(Failure::Kind::Disconnected, url, u"the answer was cut short"_s);
         return answer;
     } catch (const Poco::TimeoutException&) {
-        return callFailure(Failure::Kind::TimedOut, url, QStringLiteral("no answer within the time limit"));
+        return callFailure(Failure::Kind::TimedOut, url, u"no answer within the time limit"_s);
     } catch (const Poco::Exception& exception) {
         return callFailure(Failure::Kind::Disconnected, url, QString::fromStdString(exception.displayText()));
     } catch (const std::exception& exception) {
@@ -158,7 +161,7 @@ Result<HttpAnswer> ask(QString url, const Asking& asking, const LineCall& line, 
             return HttpAnswer(*answer);
         url = *answer->next;
     }
-    return callFailure(Failure::Kind::Refused, url, QStringLiteral("the server redirects without an end"));
+    return callFailure(Failure::Kind::Refused, url, u"the server redirects without an end"_s);
 }
 
 } // namespace

@@ -12,6 +12,9 @@
 #include <sstream>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 bool plain(const QString& text) {
@@ -72,7 +75,7 @@ void writePart(Poco::Net::MultipartWriter& parts, std::ostream& out, const std::
 
 std::string MailText(const MailAccount& account, const MailMessage& message, const QByteArray& attachment) {
     QString body = message.body;
-    body.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\n', QStringLiteral("\r\n"));
+    body.replace(u"\r\n"_s, u"\n"_s).replace(u'\n', u"\r\n"_s);
 
     std::ostringstream text;
     Poco::Net::MultipartWriter parts(text);
@@ -82,7 +85,7 @@ std::string MailText(const MailAccount& account, const MailMessage& message, con
     head.set("From", account.from.toStdString());
     head.set("To", account.to.toStdString());
     head.set("Subject", subjectField(message.subject).toStdString());
-    head.set("Message-ID", QStringLiteral("<%1@%2>").arg(id, account.from.section(u'@', -1)).toStdString());
+    head.set("Message-ID", u"<%1@%2>"_s.arg(id, account.from.section(u'@', -1)).toStdString());
     head.set("MIME-Version", "1.0");
     head.set("Content-Type", "multipart/mixed; boundary=\"" + parts.boundary() + "\"");
     head.write(text);

@@ -11,6 +11,8 @@
 #include <utility>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 struct PocoInternet::Line {
     LineAbort abort;
     EventPump* pump = nullptr;
@@ -170,8 +172,7 @@ Result<void> PocoInternet::download(const QString& url, const HostPath& target) 
             if (!answer && !content.failed())
                 return answer.failure();
             if (answer && !answer->good())
-                return Failure{Failure::Kind::Refused,
-                               QStringLiteral("%1: the server answered %2").arg(url).arg(answer->status)};
+                return Failure{Failure::Kind::Refused, u"%1: the server answered %2"_s.arg(url).arg(answer->status)};
             return content.commit();
         },
         m_line->pump);

@@ -19,6 +19,9 @@
 #include <optional>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // Some servers take less, none is known to take more; read whole, a few copies of it stand in memory.
@@ -219,7 +222,7 @@ MailOutcome sendNow(const MailAccount& account, const MailMessage& message, cons
     }
     for (const QString& address : {account.from, account.to}) {
         if (!isAddress(address))
-            return {MailEnd::RecipientRefused, QStringLiteral("\"%1\" is no mail address").arg(address)};
+            return {MailEnd::RecipientRefused, u"\"%1\" is no mail address"_s.arg(address)};
     }
     const std::string text = MailText(account, message, *attachment);
     attachment->clear();
@@ -233,7 +236,7 @@ MailOutcome SmtpMail::send(const MailAccount& account, const MailMessage& messag
         try {
             return sendNow(account, message, m_limits);
         } catch (const std::bad_alloc&) {
-            return {MailEnd::NoMemory, QStringLiteral("no memory for %1").arg(toText(message.attachment))};
+            return {MailEnd::NoMemory, u"no memory for %1"_s.arg(toText(message.attachment))};
         } catch (const std::exception& exception) {
             return {MailEnd::NoContact, QString::fromLocal8Bit(exception.what())};
         }

@@ -5,6 +5,9 @@
 #include <optional>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The middle and the last number of "5.3.4" behind the code of the reply; the first one is the first digit of the code.
@@ -14,8 +17,7 @@ struct EnhancedStatus {
 };
 
 EnhancedStatus enhancedStatus(const QByteArray& text) {
-    static const QRegularExpression form(
-        QStringLiteral("\\b[245][0-9]{2}[ -][245]\\.([0-9]{1,3})\\.([0-9]{1,3})(?:\\s|$)"));
+    static const QRegularExpression form(u"\\b[245][0-9]{2}[ -][245]\\.([0-9]{1,3})\\.([0-9]{1,3})(?:\\s|$)"_s);
     const auto match = form.match(QString::fromLatin1(text));
     return {match.captured(1).toInt(), match.captured(2).toInt()};
 }

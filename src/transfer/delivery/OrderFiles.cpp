@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // A shorter path is no folder.
@@ -40,9 +42,9 @@ QStringList BulkFiles(const QStringList& handedOver, bool inPieces) {
     QStringList pieces;
     QString sheet;
     for (const QString& path : handedOver) {
-        if (path.endsWith(QStringLiteral("txt")))
+        if (path.endsWith(u"txt"_s))
             texts += path;
-        else if (path.endsWith(QStringLiteral("prk")))
+        else if (path.endsWith(u"prk"_s))
             pieces += path;
         if (sheet.isEmpty() && IsSheet(LeafName(path)))
             sheet = path;

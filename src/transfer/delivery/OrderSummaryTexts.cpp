@@ -6,6 +6,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int pictureWidth = 320;
@@ -16,20 +18,18 @@ constexpr int letterHeight = 14;
 } // namespace
 
 QStringList OrderSummaryLines(const SessionState& state, const QDate& date) {
-    QStringList lines{date.toString(QStringLiteral("dd/MM/yyyy"))};
+    QStringList lines{date.toString(u"dd/MM/yyyy"_s)};
     if (state.transfer.SugMishloah == Sending::Resend)
-        lines += {state.wording(QStringLiteral(" משלוח חוזר "), QStringLiteral(" Resend ")),
-                  state.wording(QStringLiteral(" כדי לראות פרטי הזמנה לחץ על "),
-                                QStringLiteral(" To see the order's details press ")),
-                  state.wording(QStringLiteral(" הצג יותר פרטים "), QStringLiteral(" Show more details "))};
+        lines += {state.wording(u" משלוח חוזר "_s, u" Resend "_s),
+                  state.wording(u" כדי לראות פרטי הזמנה לחץ על "_s, u" To see the order's details press "_s),
+                  state.wording(u" הצג יותר פרטים "_s, u" Show more details "_s)};
     else
         lines += {state.shemot.n1, state.shemot.n2};
     if (state.MishloachHabaita)
-        lines += state.wording(QStringLiteral("  משלוח עד הבית  "), QStringLiteral("  Home delivery  "));
+        lines += state.wording(u"  משלוח עד הבית  "_s, u"  Home delivery  "_s);
     lines += state.shemot.ppr + state.shemot.Bord + u' ' + state.shemot.maat;
     lines += state.shemot.Hearot;
-    lines += state.wording(QStringLiteral(" סך תמונות "), QStringLiteral(" Total pictures ")) +
-             QString::number(state.shemot.TotalPics);
+    lines += state.wording(u" סך תמונות "_s, u" Total pictures "_s) + QString::number(state.shemot.TotalPics);
     lines += QStringList(4, QString());
     return lines;
 }
@@ -39,7 +39,7 @@ Bitmap OrderSummaryPicture(const QStringList& lines, Qt::LayoutDirection directi
     if (picture.isNull())
         return picture;
     QPainter painter(&picture.image());
-    QFont font(QStringLiteral("David"));
+    QFont font(u"David"_s);
     font.setPixelSize(letterHeight);
     painter.setFont(font);
     painter.setPen(Qt::black);

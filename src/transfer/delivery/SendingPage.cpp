@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int whileAPumpRuns = 20; // milliseconds
@@ -86,10 +88,9 @@ SendingGauge SendingPage::gauge() const {
     case SendingSign::Seconds:
         return {sign, m_countdown.share(), QString::number(m_countdown.seconds()), wording(u"שניות", u"seconds")};
     case SendingSign::Percent:
-        return {sign, m_shown.percent / 100.0, QStringLiteral("%1%").arg(m_shown.percent), wording(u"נשלחו", u"sent")};
+        return {sign, m_shown.percent / 100.0, u"%1%"_s.arg(m_shown.percent), wording(u"נשלחו", u"sent")};
     case SendingSign::Asking: // after a pass the ring stays full
-        return {sign, m_phase == SendingPhase::Checking ? 1.0 : 0.0, QStringLiteral("…"),
-                wording(u"בודקים", u"checking")};
+        return {sign, m_phase == SendingPhase::Checking ? 1.0 : 0.0, u"…"_s, wording(u"בודקים", u"checking")};
     default:
         return {sign, 1, {}, {}};
     }

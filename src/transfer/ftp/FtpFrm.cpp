@@ -10,9 +10,11 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
-const QString filesToSend = QStringLiteral("*.gbr;*.jpp;*.prk");
+const QString filesToSend = u"*.gbr;*.jpp;*.prk"_s;
 constexpr int countdownTick = 1000;
 constexpr int blinkTick = 500;
 constexpr int countdownFrom = 15;
@@ -41,7 +43,7 @@ void FtpFrm::load() {
 
 void FtpFrm::begin() {
     AllDone = 0;
-    if (m_state.KodMishloach == QStringLiteral("HOM")) {
+    if (m_state.KodMishloach == u"HOM"_s) {
         Label15.visible = Label4Ktovet.visible = true;
         Label4Ktovet.text = m_state.shemot.n3;
     }
@@ -200,7 +202,7 @@ void FtpFrm::succeed() {
     Image4.visible = false;
     percent = 100;
     PicInProgWidth = Pic4ProgWidth;
-    LabelProg.text = QStringLiteral("100  %");
+    LabelProg.text = u"100  %"_s;
     Picture7.visible = false; // nothing is left to warn about
 }
 

@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 // The status line of a moment: its words, and on which side its number stands. With WholeFiles an order in pieces
@@ -97,14 +99,14 @@ void FtpFrm::reached(SendingMoment moment, int number) {
         Picture6.visible = Frame9.visible = Image6.visible = false;
         break;
     case SendingMoment::PassEnds:
-        Label4Diff.text = QStringLiteral("0");
+        Label4Diff.text = u"0"_s;
         showMinutes();
         break;
     case SendingMoment::Incomplete:
         showIncomplete(number);
         break;
     case SendingMoment::NothingToSend:
-        dialogs.message(QStringLiteral("list3 is empty"));
+        dialogs.message(u"list3 is empty"_s);
         break;
     case SendingMoment::Stopped:
         pageSize = PageSize::Full;
@@ -124,10 +126,10 @@ void FtpFrm::reached(SendingMoment moment, int number) {
             QString::number(number));
         break;
     case SendingMoment::NoSession:
-        dialogs.message(QStringLiteral("No in session!"));
+        dialogs.message(u"No in session!"_s);
         break;
     case SendingMoment::NoDirectory:
-        dialogs.message(QStringLiteral("Please enter the directory to CD"));
+        dialogs.message(u"Please enter the directory to CD"_s);
         break;
     case SendingMoment::FolderFound:
         Frame9.visible = false;
@@ -181,10 +183,10 @@ void FtpFrm::progressed(int index, int count) {
     percent = UploadPercent(index, count);
     PicInProgWidth = BarWidth(percent, Pic4ProgWidth);
     const QString number = QString::number(percent);
-    caption = number + QStringLiteral(" %") +
+    caption = number + u" %"_s +
               wording(u"  נא לא לסגור את החלון עד לגמר כל המשלוח  ",
                       u"  Please do not close the window until the end of the whole sending  ");
-    LabelProg.text = number + QStringLiteral("  %");
+    LabelProg.text = number + u"  %"_s;
     Label4File.text = wording(u"קובץ %1 מתוך %2", u"File %1 of %2").arg(index + 1).arg(count);
     Q_EMIT changed();
 }
@@ -192,7 +194,7 @@ void FtpFrm::progressed(int index, int count) {
 void FtpFrm::sending(int index, int count, const QString& name) {
     status(wording(u"  כעת מעלה לשרת ", u"  Now uploading to the server "));
     if (!inPieces())
-        caption = QStringLiteral("%1 / %2 ").arg(index + 1).arg(count) +
+        caption = u"%1 / %2 "_s.arg(index + 1).arg(count) +
                   wording(u"נא לא לסגור חלון זה עד גמר כל המשלוחים    ",
                           u"Please do not close this window until all sendings end    ") +
                   OrderFolder::chosen(m_state).name();

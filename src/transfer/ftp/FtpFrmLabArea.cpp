@@ -8,12 +8,14 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void FtpFrm::refillAndSendInRounds() {
     if (isUnderWay(phase()) || AllDone == 1)
         return;
     // List3 would get the proof picture alone, and its arrival would count as that of the order.
     if (m_handedOver.isEmpty()) {
-        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        m_platform.dialogs.message(u"list3 is empty"_s);
         return;
     }
     m_sender.lists.List3.clear();
@@ -28,7 +30,7 @@ void FtpFrm::sendInRounds() {
     if (isUnderWay(phase()) || AllDone == 1 || m_sender.stop.left)
         return;
     if (lists().List3.isEmpty()) {
-        m_platform.dialogs.message(QStringLiteral("list3 is empty"));
+        m_platform.dialogs.message(u"list3 is empty"_s);
         return;
     }
     if (const auto end = m_sender.runOlderRounds())
@@ -47,7 +49,7 @@ void FtpFrm::sendChain() {
     TextList& chain = m_sender.lists.ListRezefFiles;
     for (int i = 0; i < chain.count() && !m_sender.stop.left; ++i) {
         chain.setCurrentIndex(i);
-        Label4siem.text = QStringLiteral("%1 / %2").arg(i + 1).arg(chain.count());
+        Label4siem.text = u"%1 / %2"_s.arg(i + 1).arg(chain.count());
         SendChainOrder(chain.item(i));
         if (m_sender.pass.UserStopped == 1) {
             status(wording(u"הרצף נעצר לפי בקשה של המשתמש ", u"The sequence stopped at the user's request "));

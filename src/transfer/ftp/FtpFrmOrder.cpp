@@ -18,6 +18,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 bool FtpFrm::settingsFound() {
     if (CheckFtpSettings(m_state.profile))
         return true;
@@ -40,7 +42,7 @@ void FtpFrm::listFolder() {
     clearLists();
     File1Index = -1;
     if (!order.isChosen()) {
-        Label7.text = QStringLiteral("0");
+        Label7.text = u"0"_s;
         return;
     }
     File1.setFolder(order.path());
@@ -108,7 +110,7 @@ void FtpFrm::beginResend() {
     m_chain.unload(PageId::MoogMeret);
     const OrderFolder order = OrderFolder::chosen(m_state);
     if (!order.isChosen()) {
-        Label7.text = QStringLiteral("0");
+        Label7.text = u"0"_s;
         enter(SendingPhase::NoOrder);
         return;
     }

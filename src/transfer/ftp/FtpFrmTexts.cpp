@@ -9,6 +9,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr std::array attemptTitles{
@@ -168,7 +170,7 @@ void FtpFrm::setTexts() {
           u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
           u"pictures "
           u"will be printed."}});
-    txtProxy.hint = QStringLiteral("TIS Compatible Proxy (No CERN):");
+    txtProxy.hint = u"TIS Compatible Proxy (No CERN):"_s;
     showCounts();
     tellPhase();
     Q_EMIT changed();

@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void FtpFrm::Command27_Click() {
     const auto made = m_platform.files.makeFolder(m_state.DiskRoot / u"!!AVROO");
     if (!made)
@@ -26,19 +28,19 @@ bool FtpFrm::inSession(const QString& message) {
 }
 
 QString FtpFrm::chosenRemoteName() {
-    if (!inSession(QStringLiteral("Not in session")))
+    if (!inSession(u"Not in session"_s))
         return {};
     const QString chosen = lists().List2.currentItem();
     if (chosen.isEmpty())
-        m_platform.dialogs.message(QStringLiteral("Please select the item to GET!"));
+        m_platform.dialogs.message(u"Please select the item to GET!"_s);
     return chosen.mid(chosen.lastIndexOf(u'/') + 1);
 }
 
 void FtpFrm::Command3_Click() {
-    if (!inSession(QStringLiteral("Not in session")))
+    if (!inSession(u"Not in session"_s))
         return;
     if (File1.name(File1Index).isEmpty()) {
-        m_platform.dialogs.message(QStringLiteral("Please select a local file to put"));
+        m_platform.dialogs.message(u"Please select a local file to put"_s);
         return;
     }
     m_sender.session.putHere(File1.folder() / File1.name(File1Index));
@@ -60,7 +62,7 @@ void FtpFrm::Command6_Click() {
 }
 
 void FtpFrm::Command7_Click() {
-    if (inSession(QStringLiteral("Not in session")))
+    if (inSession(u"Not in session"_s))
         m_sender.session.makeGoop();
     Q_EMIT changed();
 }
@@ -116,7 +118,7 @@ void FtpFrm::takeChain(const QStringList& folderNames) {
 
 void FtpFrm::PrepareResendHere(const DrivePath& folder) {
     const bool pieces = TravelsInPieces(folder.text());
-    File1.setPattern(pieces ? QStringLiteral("*.jpp;*.prk;*.txt") : QStringLiteral("*.jpp;*.txt"));
+    File1.setPattern(pieces ? u"*.jpp;*.prk;*.txt"_s : u"*.jpp;*.txt"_s);
     if (pieces) {
         m_state.transfer.Mefurak = Travel::Pieces;
         m_state.transfer.HazmanaP = 1;
@@ -147,9 +149,8 @@ void FtpFrm::PrepareResendHere(const DrivePath& folder) {
 void FtpFrm::FtpFatalErrorAsk(const Failure& failure, const QString& source) {
     FtpSession& session = m_sender.session;
     session.takeResponse(failure);
-    const QString text = source + QStringLiteral(" Err: ") + QString::number(LineErrorNumber(failure.kind)) +
-                         QStringLiteral(" Extd Err: ") + session.LastResponse +
-                         QStringLiteral("\r\nClose Connection and Session?");
+    const QString text = source + u" Err: "_s + QString::number(LineErrorNumber(failure.kind)) + u" Extd Err: "_s +
+                         session.LastResponse + u"\r\nClose Connection and Session?"_s;
     if (m_platform.dialogs.ask(text))
         session.closeSession();
 }

@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int ftpPauseRounds = 1600;
@@ -24,7 +26,7 @@ QString withoutFirstSlash(const QString& directory) {
 }
 
 Failure noLine() {
-    return {Failure::Kind::Disconnected, QStringLiteral("no connection to the FTP server")};
+    return {Failure::Kind::Disconnected, u"no connection to the FTP server"_s};
 }
 
 } // namespace
@@ -230,7 +232,7 @@ bool FtpSession::EnterOrderFolder() {
     FtpMakeOrderDir(name);
     pump();
     if (!bActiveSession || !hConnection) {
-        log(QStringLiteral("after MakeRemoteDir"));
+        log(u"after MakeRemoteDir"_s);
         return false;
     }
     const auto entered = hConnection->setCurrentDirectory(name);
@@ -248,7 +250,7 @@ void FtpSession::FtpMakeOrderDir(const QString& name) {
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
         trouble(LineStep::OrderFolder, made.failure());
-        log(QStringLiteral(" make remotedir fail"));
+        log(u" make remotedir fail"_s);
         return;
     }
     m_lists.List2.clear();
@@ -260,7 +262,7 @@ bool FtpSession::FtpSendFile(const QString& path) {
     if (!bActiveSession || !hConnection)
         return false;
     if (path.isEmpty()) {
-        log(QStringLiteral("sendfile-no-image selected"));
+        log(u"sendfile-no-image selected"_s);
         return false;
     }
     const QString name = LeafName(path);
@@ -275,7 +277,7 @@ bool FtpSession::FtpSendFile(const QString& path) {
     if (sent)
         return true;
     trouble(LineStep::Put, sent.failure(), name);
-    log(QStringLiteral("fail to up load") + path);
+    log(u"fail to up load"_s + path);
     m_lists.List7.append(path);
     PauseBar();
     m_lists.List4Broken.append(path);
@@ -302,7 +304,7 @@ void FtpSession::ClearListing() {
 Result<FtpListing> FtpSession::find(EmptyFolder empty) {
     if (!hConnection)
         return noLine();
-    return hConnection->list(QStringLiteral("*.*"), empty);
+    return hConnection->list(u"*.*"_s, empty);
 }
 
 void FtpSession::take(const FtpListing& listing) {
@@ -336,7 +338,7 @@ void FtpSession::listHere(EmptyFolder empty) {
         take(*found);
     } else {
         trouble(LineStep::List, found.failure());
-        FtpFatalError(found.failure(), QStringLiteral("FtpFindFirstFile"));
+        FtpFatalError(found.failure(), u"FtpFindFirstFile"_s);
     }
 }
 
@@ -356,12 +358,12 @@ bool FtpSession::FtpChangeDir(const QString& dir) {
     if (!FtpHost.isEmpty() && target.startsWith(FtpHost))
         target = target.mid(FtpHost.size());
     if (target.isEmpty())
-        target = QStringLiteral("/");
+        target = u"/"_s;
     const auto changed = hConnection ? hConnection->setCurrentDirectory(target) : Result<void>(noLine());
     RemoteDirectory = target;
     if (!changed) {
         trouble(LineStep::OrderFolder, changed.failure());
-        FtpFatalError(changed.failure(), QStringLiteral("rcd"));
+        FtpFatalError(changed.failure(), u"rcd"_s);
     }
     return changed.ok();
 }
@@ -446,7 +448,7 @@ void FtpSession::putHere(const DrivePath& path) {
     const auto local = m_platform.files.drives().toHost(path);
     const auto sent = local && hConnection ? hConnection->put(*local, path.leaf()) : Result<void>(noLine());
     if (!sent)
-        FtpFatalError(sent.failure(), QStringLiteral("FtpPutFile"));
+        FtpFatalError(sent.failure(), u"FtpPutFile"_s);
     else
         listHereAgain();
 }
@@ -455,21 +457,21 @@ void FtpSession::getHere(const QString& remoteName, const DrivePath& localFolder
     const auto local = m_platform.files.drives().toHost(localFolder / remoteName);
     const auto got = local && hConnection ? hConnection->get(remoteName, *local) : Result<void>(noLine());
     if (!got)
-        FtpFatalError(got.failure(), QStringLiteral("FtpGetFile"));
+        FtpFatalError(got.failure(), u"FtpGetFile"_s);
 }
 
 void FtpSession::removeHere(const QString& remoteName) {
     const auto removed = hConnection ? hConnection->remove(remoteName) : Result<void>(noLine());
     if (!removed)
-        FtpFatalError(removed.failure(), QStringLiteral("FtpGetFile"));
+        FtpFatalError(removed.failure(), u"FtpGetFile"_s);
     else
         listHereAgain();
 }
 
 void FtpSession::makeGoop() {
-    const auto made = hConnection ? hConnection->makeDirectory(QStringLiteral("goop")) : Result<void>(noLine());
+    const auto made = hConnection ? hConnection->makeDirectory(u"goop"_s) : Result<void>(noLine());
     if (!made)
-        FtpFatalError(made.failure(), QStringLiteral("FtpPutFile"));
+        FtpFatalError(made.failure(), u"FtpPutFile"_s);
     else
         listHereAgain();
 }

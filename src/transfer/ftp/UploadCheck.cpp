@@ -10,6 +10,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 enum class Step { Pause, Recheck, Delete, Close, Confirm, List };
@@ -87,7 +89,7 @@ void UploadCheck::filterDots() {
         const int count = m_lists.List6.count();
         for (int i = 0; i < count; ++i) {
             const QString name = m_lists.List6.item(i);
-            if (name == QStringLiteral(".") || name == QStringLiteral(".."))
+            if (name == u"."_s || name == u".."_s)
                 m_lists.List6.removeAt(i);
         }
     }

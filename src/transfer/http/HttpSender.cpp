@@ -16,12 +16,14 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int httpPauseRounds = 1801;
 // A larger file is no list.
 constexpr qint64 largestList = 4 * 1024 * 1024;
-const QString testFolder = QStringLiteral("tttt");
+const QString testFolder = u"tttt"_s;
 
 } // namespace
 
@@ -92,7 +94,7 @@ bool HttpSender::sendMissing(int) {
 
 void HttpSender::post(const QString& path) {
     const DrivePath folder = DrivePath(path).parent();
-    const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php");
+    const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     m_events.reached(SendingMoment::Answered);
     if (m_script.failed()) {
@@ -186,7 +188,7 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
     HttpPause(2);
     lists.TxtFromWeb.clear();
     HttpPause(2);
-    lists.TxtWeb = FetchUrl(siteAddress(QStringLiteral("/listfileb.php?tik=") + folderName()));
+    lists.TxtWeb = FetchUrl(siteAddress(u"/listfileb.php?tik="_s + folderName()));
     m_events.reached(SendingMoment::Answered);
     HttpPause(3);
     m_platform.pump.pump();
@@ -205,8 +207,8 @@ void HttpSender::downloadList(int listNumber) {
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)
         m_listFailure = cleared.failure();
-    const QString uploads = siteAddress(QStringLiteral("/uploads/") + folderName() + u'/');
-    download.download(uploads + QStringLiteral("filelist1.txt"), WorkspacePaths::root(m_state) / u"filelist1.txt");
+    const QString uploads = siteAddress(u"/uploads/"_s + folderName() + u'/');
+    download.download(uploads + u"filelist1.txt"_s, WorkspacePaths::root(m_state) / u"filelist1.txt");
     HttpPause(2);
     const QString remote = ListFileName(listNumber);
     if (cleared && !remote.isEmpty()) {
@@ -232,23 +234,22 @@ void HttpSender::HttpSendDone() const {
 
 void HttpSender::postTestPicture() {
     const QString& host = m_state.profile.HttpHost;
-    const QString scheme = QStringLiteral("://");
+    const QString scheme = u"://"_s;
     const QString bare = host.contains(scheme) ? host.mid(host.indexOf(scheme) + scheme.size()) : host;
-    lists.TxtWeb = m_script.MultipartPostInet(testFolder, {QStringLiteral("4445.png")}, bare,
-                                              m_state.profile.HttpScriptPath + QStringLiteral("getfile2.php"),
+    lists.TxtWeb = m_script.MultipartPostInet(testFolder, {u"4445.png"_s}, bare,
+                                              m_state.profile.HttpScriptPath + u"getfile2.php"_s,
                                               WorkspacePaths::root(m_state), lists.TxtUrl);
 }
 
 void HttpSender::postNothing() {
-    lists.TxtWeb = m_script.MultipartPost(testFolder, {},
-                                          m_state.profile.HttpHost + m_state.profile.HttpScriptPath +
-                                              QStringLiteral("uploads/listfile.php"),
-                                          {}, lists.TxtUrl, {}, {});
+    lists.TxtWeb = m_script.MultipartPost(
+        testFolder, {}, m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"uploads/listfile.php"_s, {},
+        lists.TxtUrl, {}, {});
 }
 
 void HttpSender::fetchTestListing() {
-    lists.TxtWeb = FetchUrl(m_state.profile.HttpHost + m_state.profile.HttpScriptPath +
-                            QStringLiteral("listfile.php?tik=") + testFolder);
+    lists.TxtWeb =
+        FetchUrl(m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"listfile.php?tik="_s + testFolder);
 }
 
 } // namespace lumora

@@ -6,10 +6,12 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr qsizetype longestAnswer = 35;
-const QString total = QStringLiteral("total:");
+const QString total = u"total:"_s;
 
 bool namesTotal(const QString& entry) {
     return entry.contains(total, Qt::CaseInsensitive);
@@ -21,7 +23,7 @@ QStringList ParseServerList(const QString& text) {
     const QString whole = text.trimmed();
     if (whole.size() <= longestAnswer)
         return {};
-    QStringList entries = whole.split(QStringLiteral("~~"));
+    QStringList entries = whole.split(u"~~"_s);
     entries.removeIf([](const QString& entry) { return entry.trimmed().isEmpty(); });
     return entries;
 }
@@ -43,7 +45,7 @@ QStringList MarkHossarim(const QStringList& files, const QStringList& entries, c
 
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {
     ServerAnswer read;
-    if (answer.contains(QStringLiteral("not"), Qt::CaseInsensitive))
+    if (answer.contains(u"not"_s, Qt::CaseInsensitive))
         return read;
     read.entries = ParseServerList(answer);
     read.namesFolder = std::any_of(read.entries.begin(), read.entries.end(),
@@ -56,7 +58,7 @@ ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) 
 QString ListFileName(int number) {
     if (number < 0 || number > 3)
         return {};
-    return number == 0 ? QStringLiteral("filelisthom.txt") : QStringLiteral("filelisthom%1.txt").arg(number);
+    return number == 0 ? u"filelisthom.txt"_s : u"filelisthom%1.txt"_s.arg(number);
 }
 
 } // namespace lumora

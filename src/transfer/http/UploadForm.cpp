@@ -9,6 +9,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int panelTick = 1;
@@ -172,8 +174,8 @@ void UploadForm::sendMissing() {
 
 void UploadForm::succeed() {
     percent = 100;
-    Label7.text = QStringLiteral("100");
-    caption = QStringLiteral("100%");
+    Label7.text = u"100"_s;
+    caption = u"100%"_s;
     PicSargel1Width = PicSargel2Width;
     Label1.text.clear();
     Label4Reason.visible = false;

@@ -5,6 +5,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 void UploadForm::reached(SendingMoment moment, int number) {
     switch (moment) {
     case SendingMoment::AttemptBegins:
@@ -16,7 +18,7 @@ void UploadForm::reached(SendingMoment moment, int number) {
         Label4Tel.visible = !Label10.text.trimmed().isEmpty();
         PicSargel1Width = 1;
         percent = 0;
-        Label7.text = QStringLiteral("0");
+        Label7.text = u"0"_s;
         Label9.visible = true;
         enter(SendingPhase::Sending);
         break;
@@ -54,7 +56,7 @@ void UploadForm::progressed(int index, int count) {
         percent = static_cast<int>(share);
         PicSargel1Width = static_cast<int>(PicSargel2Width * share / 100);
     }
-    caption = Label7.text + QStringLiteral(" %   ") +
+    caption = Label7.text + u" %   "_s +
               wording(u"נא לא לסגור עד גמר המשלוח", u"Please do not close until the end of the sending");
     Q_EMIT changed();
 }

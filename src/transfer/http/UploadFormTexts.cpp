@@ -7,6 +7,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 // The page never enters Stopped or Unclear.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
@@ -85,7 +87,7 @@ void UploadForm::showTrouble() {
 
 void UploadForm::showLeft(int files) {
     Label12.text = QString::number(files);
-    Label4Left.text = Label4Notru.text.trimmed() + QStringLiteral(": ") + Label12.text;
+    Label4Left.text = Label4Notru.text.trimmed() + u": "_s + Label12.text;
     Label4Left.visible = !hasArrived(phase());
 }
 
@@ -111,7 +113,7 @@ void UploadForm::setTexts() {
                           {Label4Rshom, u"נא לרשום את מספר ההזמנה ", u"Please write down the order number"},
                           {Label4Alu, u" הקבצים עלו בהצלחה ", u"The files went up successfully"},
                           {Label4Tashlum, u"נא להתקשר לחנות לגבי תשלום", u"Please call the shop about payment"}});
-    Label4Left.text = Label4Notru.text.trimmed() + QStringLiteral(": ") + Label12.text;
+    Label4Left.text = Label4Notru.text.trimmed() + u": "_s + Label12.text;
     tellPhase();
     Q_EMIT changed();
 }

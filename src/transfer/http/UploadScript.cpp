@@ -8,13 +8,15 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr char boundary[] = "OLA_GRAIN";
 constexpr char newLine[] = "\r\n";
 
 QString address(const QString& url, const QString& folderName, const QString& extra) {
-    return url + QStringLiteral("?folder=") + folderName + u'&' + extra;
+    return url + u"?folder="_s + folderName + u'&' + extra;
 }
 
 // LeafName needs a path; a bare name is already a leaf.
@@ -63,7 +65,7 @@ Result<QByteArray> UploadScript::readParts(const QStringList& files, const Drive
     for (const QString& file : files) {
         const QString name = leafOf(file);
         if (breaksHeader(name))
-            return Failure{Failure::Kind::Unsupported, QStringLiteral("%1: the name can't be sent").arg(name)};
+            return Failure{Failure::Kind::Unsupported, u"%1: the name can't be sent"_s.arg(name)};
         auto bytes = m_platform.files.read(localFolder / name);
         if (!bytes)
             return bytes.failure();
@@ -100,13 +102,12 @@ QString UploadScript::MultipartPostInet(const QString& folderName, const QString
         request.contentType = QByteArray("multipart/form-data, boundary=") + boundary;
         request.body = std::move(*body);
         request.announcedLength = 2 * request.body.size() - 1;
-        const auto answer =
-            m_platform.internet.post(QStringLiteral("http://") + server + address(url, folderName, extra), request);
+        const auto answer = m_platform.internet.post(u"http://"_s + server + address(url, folderName, extra), request);
         if (answer)
             return AnsiCodePage::decode(*answer);
         m_failure = answer.failure();
     }
-    return QStringLiteral("Error: ") + m_failure.message;
+    return u"Error: "_s + m_failure.message;
 }
 
 } // namespace lumora

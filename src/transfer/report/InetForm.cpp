@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 InetForm::InetForm(const SessionState& state, const Platform& platform, PageChain& chain)
     : Page(PageId::InetForm)
     , m_state(state)
@@ -20,7 +22,7 @@ InetForm::InetForm(const SessionState& state, const Platform& platform, PageChai
 
 QString InetForm::FetchUrlSmall(const QString& url) {
     if (!m_platform.internet.open())
-        m_platform.dialogs.message(m_state.wording(QStringLiteral("אין תקשורת"), QStringLiteral("No communication")));
+        m_platform.dialogs.message(m_state.wording(u"אין תקשורת"_s, u"No communication"_s));
     const auto body = m_platform.internet.fetch(url);
     return body ? AnsiCodePage::decode(*body) : QString();
 }
@@ -30,7 +32,7 @@ void InetForm::reportOrder() {
     const QString query = OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
     const QString& script = m_state.profile.ReportUrl;
     // The lab's site expects a call of this address before each report.
-    TeshuvatSharat = FetchUrlSmall(script + QStringLiteral("c.txt"));
+    TeshuvatSharat = FetchUrlSmall(script + u"c.txt"_s);
     TeshuvatSharat = FetchUrlSmall(script + query);
     Q_EMIT changed();
 }
