@@ -73,7 +73,7 @@ protected:
 
     QTemporaryDir folder;
     MailMessage message;
-    SmtpMail mail{TimeLimits{Poco::Timespan(2, 0), Poco::Timespan(3, 0)}};
+    SmtpMail mail{TimeLimits{Poco::Timespan(60, 0), Poco::Timespan(60, 0)}};
 };
 
 TEST_F(MailTest, AFileArrivesByteForByteWithSubjectBodyAndName) {
