@@ -12,8 +12,10 @@ void LineAbort::abort() {
     const std::lock_guard lock(m_mutex);
     ++m_count;
     for (const int descriptor : m_descriptors) {
-        const linger resetAtClose{1, 0};
-        ::setsockopt(descriptor, SOL_SOCKET, SO_LINGER, &resetAtClose, sizeof(resetAtClose));
+        // Linux resets a connection that is given no peer; a shutdown alone would end the data in good order. The
+        // shutdown wakes who waits where nothing is connected yet.
+        const sockaddr nobody{AF_UNSPEC, {}};
+        ::connect(descriptor, &nobody, sizeof(nobody));
         ::shutdown(descriptor, SHUT_RDWR);
     }
 }
