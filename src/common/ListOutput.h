@@ -37,6 +37,8 @@ private:
 
 // One entry of an order log: the key, and the rest of the line less its outer quotes.
 struct ListOutputEntry {
+    bool operator==(const ListOutputEntry&) const = default;
+
     QString key;
     QString value;
 };

@@ -93,6 +93,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.serial = value;
     else if (key == u"Optint")
         state.kind = static_cast<OrderKind>(Val16(value));
+    else if (key == u"Replaces")
+        state.replaces = value;
     else if (key == u"InHand")
         state.filesInHand += value;
     else if (key == u"Shoora")
@@ -122,7 +124,9 @@ QByteArray OrderState::write() const {
     writer.word("Report", reports, report);
     for (const QString& path : filesInHand)
         writer.text(u"InHand"_s, path);
-    if (phase == Phase::Preparing) {
+    if (!replaces.isEmpty())
+        writer.text(u"Replaces"_s, replaces);
+    if (phase <= Phase::Prepared) {
         for (const auto& [key, value] : choices)
             writer.text(choicePrefix + key, value);
         for (const QString& item : items)

@@ -18,7 +18,7 @@ struct OrderState {
     enum class Phase {
         Preparing, // prints are being made; the basket and the choices are kept with it
         Prepared,  // whole on the disk, nothing of it sent
-        Sending,   // a part may lie on the server
+        Sending,   // its folder on the server was entered; a part may lie there
         Arrived,   // proven to lie on the server
         Reported,  // arrived, and the lab was told or needs no telling
     };
@@ -37,9 +37,12 @@ struct OrderState {
     bool provenByNameOnly = false; // the server told no lengths
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;
-    QStringList items;              // lines of the basket; written while preparing only, like the choices
+    QString replaces;               // folder name of the order that this one was prepared again from
+    QStringList items;              // lines of the basket; kept until the sending begins, like the choices
     QList<ListOutputEntry> choices; // as OrderChoices has them
     QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
+
+    bool operator==(const OrderState&) const = default;
 
     QByteArray write() const;
     // Damaged: not whole, or with a word that this version does not know.

@@ -110,6 +110,30 @@ TEST_F(FilesTest, MakesFoldersForTheirOwnerOnly) {
     EXPECT_FALSE(files.makeNewFolder(u"C:\\no\\parent"_path).ok());
 }
 
+TEST_F(FilesTest, RemovesAWholeTreeButNoFolderOfTheDriveItself) {
+    put("work/order/.kept/one.jpg");
+    put("work/order/.order");
+    put("work/other/a.jpg");
+    fs::create_directory_symlink(data / "work" / "other", data / "work" / "order" / "link");
+    for (const DrivePath& path : {u"C:\\"_path, u"C:\\work"_path, u"C:\\work\\"_path, u"C:\\work\\.."_path})
+        EXPECT_FALSE(files.removeTree(path)) << path.text().toStdString();
+    ASSERT_TRUE(files.removeTree(u"C:\\work\\order"_path));
+    ASSERT_TRUE(files.removeTree(u"C:\\work\\order"_path)); // again
+    EXPECT_FALSE(fs::exists(data / "work" / "order"));
+    EXPECT_TRUE(fs::exists(data / "work" / "other" / "a.jpg"));
+}
+
+TEST_F(FilesTest, KeepsACopyThatStaysWhenTheSourceIsReplacedOrRemoved) {
+    put("a.jpg", "first");
+    ASSERT_TRUE(files.keepCopy(u"C:\\a.jpg"_path, u"C:\\kept.jpg"_path));
+    ASSERT_TRUE(files.writeWhole(u"C:\\a.jpg"_path, "second"));
+    EXPECT_EQ(files.read(u"C:\\kept.jpg"_path).value(), "first");
+    ASSERT_TRUE(files.keepCopy(u"C:\\a.jpg"_path, u"C:\\kept.jpg"_path)) << "over an older one";
+    ASSERT_TRUE(files.removeFile(u"C:\\a.jpg"_path));
+    EXPECT_EQ(files.read(u"C:\\kept.jpg"_path).value(), "second");
+    EXPECT_FALSE(files.keepCopy(u"C:\\a.jpg"_path, u"C:\\kept.jpg"_path));
+}
+
 TEST_F(FilesTest, StoresUnderALongHebrewNameAndFindsItAgain) {
     const DrivePath path = u"C:\\"_path / (QString(200, QChar(0x05D0)) + u".jpg"_s);
     ASSERT_TRUE(files.writeWhole(path, "view"));

@@ -158,6 +158,18 @@ Result<void> Files::removeFile(const DrivePath& path) const {
     return {};
 }
 
+Result<void> Files::removeTree(const DrivePath& path) const {
+    const DrivePath folder = path.folder();
+    if (!folder.text().contains(u'\\') || QStringList{QString(), u"."_s, u".."_s}.contains(path.leaf()))
+        return failure(Failure::Kind::Refused, path, u"a folder of the drive itself is not removed"_s);
+    const auto found = host(path);
+    if (!found)
+        return found.failure();
+    std::error_code error;
+    fs::remove_all(*found, error);
+    return error ? Result<void>(systemFailure(error.value(), path.text())) : Result<void>();
+}
+
 Result<QByteArray> Files::read(const DrivePath& path) const {
     const auto found = host(path);
     if (!found)
@@ -188,6 +200,16 @@ Result<void> Files::copyFile(const DrivePath& source, const DrivePath& target) c
     if (!copied)
         return copied.failure();
     return content.commit();
+}
+
+Result<void> Files::keepCopy(const DrivePath& source, const DrivePath& target) const {
+    const auto from = host(source);
+    const auto to = host(target);
+    std::error_code error;
+    if (from && to && fs::is_regular_file(*from, error) && !fs::is_symlink(*from, error) &&
+        ::link(from->c_str(), to->c_str()) == 0)
+        return {};
+    return copyFile(source, target);
 }
 
 Result<qint64> Files::size(const DrivePath& path) const {

@@ -27,6 +27,9 @@ public:
     // True if this call made the folder, false if the name exists already: of two programs only one gets true.
     Result<bool> makeNewFolder(const DrivePath& path) const;
     Result<void> removeFile(const DrivePath& path) const;
+    // Removes a folder with all that it holds, hidden entries too; a link is removed, not what it leads to. Refused for
+    // a drive and for a folder that lies directly on one.
+    Result<void> removeTree(const DrivePath& path) const;
 
     Result<QByteArray> read(const DrivePath& path) const;
 
@@ -39,6 +42,10 @@ public:
 
     // Copies in the same way. The source is opened for reading only.
     Result<void> copyFile(const DrivePath& source, const DrivePath& target) const;
+
+    // The target holds what the source holds now: a second name of the file where the disk allows it, else a copy. For
+    // files that are only ever replaced as a whole.
+    Result<void> keepCopy(const DrivePath& source, const DrivePath& target) const;
 
     Result<qint64> size(const DrivePath& path) const;
 

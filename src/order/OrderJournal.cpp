@@ -1,0 +1,148 @@
+#include "order/OrderJournal.h"
+
+#include "order/OrderChoices.h"
+#include "order/OrderNames.h"
+#include "order/OrderSender.h"
+#include "platform/files/Files.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+using Phase = OrderState::Phase;
+using Way = OrderState::Way;
+
+namespace {
+
+Way wayOf(Sender by) {
+    return by == Sender::Http ? Way::Http : Way::Ftp;
+}
+
+} // namespace
+
+OrderJournal::OrderJournal(const Files& files, OrderFolder folder)
+    : m_files(files)
+    , m_folder(std::move(folder)) {
+    if (const Result<OrderState> read = ReadOrderState(m_files, m_folder)) {
+        m_state = *read;
+        m_known = m_kept = true;
+    }
+}
+
+void OrderJournal::makeKnown() {
+    if (m_known)
+        return;
+    const QString name = m_folder.name();
+    m_state = {};
+    m_state.phase = Phase::Prepared;
+    m_state.number = OrderNumberOf(name);
+    if (TravelsInPieces(m_state.number))
+        m_state.number.chop(1);
+    m_state.serial = name.left(name.lastIndexOf(u'^')).section(u'_', -1);
+    m_state.way = wayOf(SenderMadeFor(m_files, m_folder).value_or(Sender::Ftp));
+    m_known = true;
+}
+
+// The step counts for this run even where it can't be written; the next one tries again.
+Result<void> OrderJournal::keep(const OrderState& next) {
+    if (m_kept && next == m_state)
+        return {};
+    m_state = next;
+    const Result<void> written = WriteOrderState(m_files, m_folder, m_state);
+    m_kept = written.ok();
+    return written;
+}
+
+Result<void> OrderJournal::begin(const SessionState& session, Way way, const QStringList& lines,
+                                 const DrivePath& replaces) {
+    OrderState next;
+    next.number = session.MisparHazmana;
+    next.serial = session.shemot.ser;
+    next.kind = session.Optint;
+    next.way = way;
+    next.items = lines;
+    next.choices = ChoicesOf(session);
+    next.replaces = replaces.isEmpty() ? QString() : replaces.leaf();
+    m_known = true;
+    return keep(next);
+}
+
+Result<void> OrderJournal::prepared() {
+    makeKnown();
+    OrderState next = m_state;
+    next.phase = Phase::Prepared;
+    return keep(next);
+}
+
+Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
+    makeKnown();
+    OrderState next = m_state;
+    next.folderMadeByUs = next.folderMadeByUs || ours;
+    next.phase = std::max(next.phase, Phase::Sending);
+    if (next.way == Way::Station || next.way == Way::Mail)
+        next.way = wayOf(by);
+    const Result<void> kept = keep(next);
+    if (kept) {
+        const DrivePath aside = m_folder.filePath(u".kept"_s);
+        if (m_files.folderExists(aside))
+            static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
+    }
+    return kept;
+}
+
+Result<void> OrderJournal::take(const QString& path) {
+    makeKnown();
+    OrderState next = m_state;
+    if (!next.filesInHand.contains(path))
+        next.filesInHand += path;
+    return keep(next);
+}
+
+Result<void> OrderJournal::release(const QString& path) {
+    makeKnown();
+    OrderState next = m_state;
+    next.filesInHand.removeAll(path);
+    return keep(next);
+}
+
+Result<void> OrderJournal::arrived(bool byNameOnly) {
+    makeKnown();
+    OrderState next = m_state;
+    next.phase = std::max(next.phase, Phase::Arrived);
+    next.provenByNameOnly = byNameOnly;
+    return keep(next);
+}
+
+Result<void> OrderJournal::reportBegun() {
+    makeKnown();
+    OrderState next = m_state;
+    next.report = OrderState::Report::Begun;
+    return keep(next);
+}
+
+Result<void> OrderJournal::reportDone() {
+    makeKnown();
+    OrderState next = m_state;
+    next.report = OrderState::Report::Done;
+    next.phase = Phase::Reported;
+    return keep(next);
+}
+
+Result<void> OrderJournal::needsNoReport() {
+    makeKnown();
+    OrderState next = m_state;
+    next.phase = Phase::Reported;
+    return keep(next);
+}
+
+Result<void> OrderJournal::wentByMail() {
+    makeKnown();
+    OrderState next = m_state;
+    next.way = Way::Mail;
+    return keep(next);
+}
+
+} // namespace lumora

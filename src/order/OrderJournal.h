@@ -1,0 +1,60 @@
+#pragma once
+
+#include "common/DrivePath.h"
+#include "common/Result.h"
+#include "order/OrderFolder.h"
+#include "order/OrderState.h"
+#include "session/SessionState.h"
+
+#include <QString>
+#include <QStringList>
+
+namespace lumora {
+
+class Files;
+
+// The state of one order as it goes on: each step is kept in the order's folder before the next begins. All writes of
+// a state go through it. A call that changes nothing writes nothing. An order without a state, which was made by an
+// older version or by hand, gets one at its first step here.
+class OrderJournal {
+public:
+    // Reads the state. An order without one, or with a damaged one, is not known.
+    OrderJournal(const Files& files, OrderFolder folder);
+
+    bool known() const { return m_known; }
+    const OrderState& state() const { return m_state; }
+    const OrderFolder& folder() const { return m_folder; }
+
+    // The folder is claimed, and the preparation begins: keeps the lines of the basket and what the customer chose.
+    // replaces: the folder of the order that this one is prepared again from, or empty.
+    Result<void> begin(const SessionState& session, OrderState::Way way, const QStringList& lines,
+                       const DrivePath& replaces = {});
+    // The log is written: the order is whole.
+    Result<void> prepared();
+    // The folder on the server is entered for sending; the basket is dropped, and with it what was kept aside for the
+    // preparation. ours: this order has made it, or it is known to hold nothing of another order. An order that has
+    // arrived stays so.
+    Result<void> sendingBegins(Sender by, bool ours);
+    // A file's full path, before its put and behind the put that was confirmed.
+    Result<void> take(const QString& path);
+    Result<void> release(const QString& path);
+    Result<void> arrived(bool byNameOnly);
+    // Before report and done call, and behind them.
+    Result<void> reportBegun();
+    Result<void> reportDone();
+    // The order has arrived and the lab wants no report.
+    Result<void> needsNoReport();
+    Result<void> wentByMail();
+
+private:
+    void makeKnown();
+    Result<void> keep(const OrderState& next);
+
+    const Files& m_files;
+    OrderFolder m_folder;
+    OrderState m_state;
+    bool m_known = false;
+    bool m_kept = false; // the file holds m_state
+};
+
+} // namespace lumora
