@@ -421,6 +421,7 @@ Result<void> FtpSessionWire::put(const HostPath& local, const QString& remoteNam
                 if (*count == 0)
                     break;
                 sendAll(data, bytes.data(), *count);
+                m_call.moved(static_cast<std::int64_t>(*count));
             }
             data.shutdownSend();
             return {};
@@ -442,6 +443,7 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
                 const int count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
                 if (count <= 0)
                     return {};
+                m_call.moved(count);
                 content.append(bytes.data(), static_cast<std::size_t>(count));
                 if (content.failed())
                     return content.commit();
@@ -465,6 +467,7 @@ Result<FtpListing> FtpSessionWire::list(const QString& pattern, EmptyFolder empt
                     const int count = data.receiveBytes(part.data(), static_cast<int>(part.size()));
                     if (count <= 0)
                         return {};
+                    m_call.moved(count);
                     listing.append(part.data(), count);
                     if (listing.size() > longestListing)
                         return Failure{Failure::Kind::TooLarge, u"ftp %1: a listing without an end"_s.arg(m_host)};

@@ -131,6 +131,7 @@ Result<Answered> askOnce(const QString& url, const Address& to, const Asking& as
         while (body.good()) {
             body.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
             received += body.gcount();
+            line.moved(body.gcount());
             if (body.gcount() > 0 && !sink(bytes.data(), static_cast<std::size_t>(body.gcount())))
                 return callFailure(Failure::Kind::TooLarge, url, u"the answer could not be taken whole"_s);
         }
@@ -200,12 +201,17 @@ Result<HttpAnswer> HttpPost(const QString& url, const PostRequest& post, const L
                                             AnsiCodePage::encode(post.password).toStdString())
                 .authenticate(request);
     };
+    const auto write = [&line](std::ostream& out, const char* bytes, qint64 count) {
+        out.write(bytes, count);
+        if (out.good())
+            line.moved(count);
+    };
     asking.send = [&](std::ostream& out) {
         for (qint64 at = 0; at < post.body.size() && out.good(); at += pieceOfBody)
-            out.write(post.body.constData() + at, std::min<qint64>(pieceOfBody, post.body.size() - at));
+            write(out, post.body.constData() + at, std::min<qint64>(pieceOfBody, post.body.size() - at));
         static constexpr std::array<char, pieceOfBody> zeros{};
         for (qint64 left = announced - post.body.size(); left > 0 && out.good(); left -= pieceOfBody)
-            out.write(zeros.data(), std::min<qint64>(pieceOfBody, left));
+            write(out, zeros.data(), std::min<qint64>(pieceOfBody, left));
     };
     return ask(url, asking, line, sink);
 }

@@ -95,6 +95,8 @@ public:
     virtual void abort() {}
     // While a pump is given, a call that waits on its thread pumps, so that a click may abort it.
     virtual void pumpWhileWaiting(EventPump*) {}
+    // A running count of the bytes of files, listings and bodies in both directions.
+    virtual qint64 bytesMoved() const { return 0; }
 
     // GET, past every cache. A redirect to the same host is followed, at most five in a row. The URL goes out as it
     // stands, in the ANSI code page, only a blank as %20; CR, LF and NUL count as blanks and "#" does not cut. The

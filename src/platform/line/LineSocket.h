@@ -21,6 +21,8 @@ public:
     const TimeLimits& limits() const { return m_limits; }
     LineAbort& line() const { return *m_line; }
     bool aborted() const { return m_line->count() != m_begun; }
+    // Counts bytes of a transfer.
+    void moved(std::int64_t bytes) const { m_line->moved(bytes); }
     // Throws when the line has been cut.
     void check() const;
 

@@ -90,6 +90,10 @@ void PocoInternet::pumpWhileWaiting(EventPump* pump) {
     m_line->pump = pump;
 }
 
+qint64 PocoInternet::bytesMoved() const {
+    return m_line->abort.bytesMoved();
+}
+
 bool PocoInternet::connectedState() const {
     ifaddrs* all = nullptr;
     if (::getifaddrs(&all) != 0)

@@ -18,6 +18,7 @@ public:
                                                       DataChannel channel) override;
     void abort() override;
     void pumpWhileWaiting(EventPump* pump) override;
+    qint64 bytesMoved() const override;
     Result<QByteArray> fetch(const QString& url) override;
     Result<QByteArray> post(const QString& url, const PostRequest& request) override;
     Result<std::optional<qint64>> contentLength(const QString& url) override;
