@@ -14,11 +14,11 @@ void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const Sen
 std::optional<SendingPhase> Attempts::run(int attempts, SendingMoment beginning) {
     for (int attempt = 1; attempt <= attempts; ++attempt) {
         m_events.reached(beginning, attempt);
-        const bool passed = sendMissing(attempt);
+        const std::optional<SendingPhase> ended = sendMissing(attempt);
         if (m_stop.left)
             return std::nullopt;
-        if (!passed)
-            return SendingPhase::Stopped;
+        if (ended)
+            return ended;
         m_events.reached(SendingMoment::CheckBegins);
         const std::optional<SendingPhase> end = checkArrival(attempt);
         if (m_stop.left)

@@ -33,8 +33,8 @@ protected:
         , m_stop(stop) {}
     ~Attempts() = default;
 
-    // False when the customer has stopped the sending.
-    virtual bool sendMissing(int attempt) = 0;
+    // A value ends the sending without a check: Stopped by the customer, or an end that another attempt would not mend.
+    virtual std::optional<SendingPhase> sendMissing(int attempt) = 0;
     // The end of the sending, or no value when another attempt is needed.
     virtual std::optional<SendingPhase> checkArrival(int attempt) = 0;
     virtual SendingPhase afterTheLast() = 0;

@@ -10,8 +10,21 @@ struct SessionState;
 
 // The step of the transfer that failed. File: a file of the order can't be read or its name can't be sent. Confirm: the
 // connection held, but the server's list does not confirm that all files arrived. KeepList: the server's list could not
-// be written on this machine.
-enum class LineStep { Open, Connect, OrderFolder, File, Put, List, Confirm, KeepList };
+// be written on this machine. ServerChanges: the server stores other bytes than were sent. ForeignFolder: the server
+// has another order under this one's name. Silence: the line stood still or went too slowly for too long.
+enum class LineStep {
+    Open,
+    Connect,
+    OrderFolder,
+    File,
+    Put,
+    List,
+    Confirm,
+    KeepList,
+    ServerChanges,
+    ForeignFolder,
+    Silence
+};
 
 // What a failure of the transfer means for the customer. subject is the file's name, if the step is about a file.
 QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject = {});

@@ -65,6 +65,17 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
             u"רשימת הקבצים מהשרת לא נכתבה במחשב זה. יש לפנות מקום בדיסק או לתקן את ההרשאות ולנסות שוב."_s,
             u"The server's list of files can't be written on this computer. Free some space or mend the "
             u"rights, then try again."_s);
+    case LineStep::ServerChanges:
+        return state.wording(u"השרת של המעבדה משנה את הקבצים בדרך. יש להתקשר למעבדה."_s,
+                             u"The lab's server changes files on the way. Please call the lab."_s);
+    case LineStep::ForeignFolder:
+        return state.wording(u"בשרת כבר יש הזמנה אחרת בשם זה, ולכן לא נשלח דבר. יש להתקשר למעבדה."_s,
+                             u"The server already holds another order under this name, so nothing was sent. Please "
+                             u"call the lab."_s);
+    case LineStep::Silence:
+        return state.wording(u"השרת אינו עונה או שהקו איטי מדי, ולכן השליחה הופסקה. יש לנסות שוב מאוחר יותר."_s,
+                             u"The server does not answer or the line is too slow, so the sending has ended. Please "
+                             u"try again later."_s);
     }
     return failure.message;
 }

@@ -16,10 +16,12 @@ enum class SendingPhase {
     Checking,  // the server is asked which files have arrived
     Reporting, // all files have arrived; the lab's site is told
     Success,
-    AllThere, // all files are on the server; no report was sent
-    Unclear,  // the server's list gives no clear answer
-    NotAll,   // files are missing after the last attempt
-    Stopped,  // the customer has stopped the sending
+    AllThere,    // all files are on the server; no report was sent
+    Unclear,     // the server's list gives no clear answer
+    NotAll,      // files are missing after the last attempt
+    Stopped,     // the customer has stopped the sending
+    CallLab,     // nothing that the customer can do helps
+    NumberTaken, // the order's name is another order's on the server; it is prepared again, and the page is left
 };
 
 constexpr bool isUnderWay(SendingPhase phase) {

@@ -22,5 +22,7 @@ inline constexpr SendingWords checkingAdvice{u"בודקים אילו קבצים 
                                              u"Checking which files have arrived. Please wait."};
 inline constexpr SendingWords reportingAdvice{u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
                                               u"The whole order has arrived. Telling the shop, please wait."};
+inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
+                                            u"The order is kept on this computer. Please call the lab."};
 
 } // namespace lumora

@@ -6,7 +6,6 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "transfer/report/InetForm.h"
 
 namespace lumora {
 
@@ -189,11 +188,7 @@ void FtpFrm::succeed() {
     status(wording(u" מיד מסיימים ", u" Finishing at once "));
     captionFollowsStatus();
     m_platform.pump.pump();
-    if (m_state.profile.ReportOn > 0 && m_chain.isRegistered(PageId::InetForm)) {
-        auto& reports = m_chain.load<InetForm>();
-        reports.reportOrder();
-        reports.reportDone();
-    }
+    tellLab();
     forgetReason();
     status(wording(u"הקבצים הועלו בהצלחה", u"The files were uploaded successfully"));
     captionFollowsStatus();

@@ -110,6 +110,12 @@ private:
     void showProof();
     void FtpEnableControls(bool enable);
 
+    // FtpFrmGuards.cpp
+    bool mayBeSent();    // what List3 names makes an order
+    void prepareAgain(); // the order's number is another order's on the server
+    void tellLab();      // report and done call
+    void watchLine();    // each second of a sending
+
     // FtpFrmTexts.cpp
     std::span<const PhaseLook> looks() const override;
     QString advice(const PhaseLook& row) const override;

@@ -78,6 +78,7 @@ std::span<const PhaseLook> FtpFrm::looks() const {
                   {SendAgain, NewOrder},
                   notCompleteTitle,
                   {u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן שלח שוב.", u"Wait 30 seconds, then press Send again."}},
+        PhaseLook{SendingPhase::CallLab, SendingSign::Bad, NewOrder, {NewOrder}, notCompleteTitle, callLabAdvice},
         PhaseLook{SendingPhase::Stopped,
                   SendingSign::Bad,
                   SendAgain,

@@ -13,9 +13,9 @@ public:
         , m_sender(sender) {}
 
 private:
-    bool sendMissing(int) override {
+    std::optional<SendingPhase> sendMissing(int) override {
         m_sender.pass.run();
-        return m_sender.pass.UserStopped == 0;
+        return m_sender.pass.UserStopped == 0 ? std::nullopt : std::optional(SendingPhase::Stopped);
     }
 
     std::optional<SendingPhase> checkArrival(int attempt) override {
@@ -73,14 +73,14 @@ public:
 private:
     static constexpr int mostConnectFails = 5;
 
-    bool sendMissing(int) override {
+    std::optional<SendingPhase> sendMissing(int) override {
         m_stop.StopFlag = false;
         for (int i = 0; i < m_sender.lists.List3.count() && m_sender.session.ConnectFails <= mostConnectFails; ++i) {
             if (m_stop.StopFlag || m_stop.left)
                 break;
             m_sender.pass.UploadOneFile(i);
         }
-        return !stopped();
+        return stopped() ? std::optional(SendingPhase::Stopped) : std::nullopt;
     }
 
     std::optional<SendingPhase> checkArrival(int round) override {

@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderFolder.h"
+#include "order/OrderSender.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -32,7 +33,7 @@ Failure noLine() {
 } // namespace
 
 bool CheckFtpSettings(const ClientProfile& profile) {
-    return !profile.FtpUser.isEmpty() && !profile.FtpServer.isEmpty() && !profile.FtpPassword.isEmpty();
+    return SenderSetUp(profile, Sender::Ftp);
 }
 
 FtpSession::FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform,

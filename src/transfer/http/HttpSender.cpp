@@ -74,7 +74,7 @@ std::optional<SendingPhase> HttpSender::HttpAttempts() {
     return run(attempts);
 }
 
-bool HttpSender::sendMissing(int) {
+std::optional<SendingPhase> HttpSender::sendMissing(int) {
     const QStringList files = lists.List4Hossarim.items();
     m_left = static_cast<int>(files.size());
     m_allPosted = true;
@@ -82,14 +82,14 @@ bool HttpSender::sendMissing(int) {
         m_events.sending(i, static_cast<int>(files.size()), LeafName(files[i]));
         HttpPause();
         if (m_stop.left)
-            return false;
+            return std::nullopt;
         post(files[i]);
         m_platform.pump.pump();
         m_events.progressed(i, lists.List4Hossarim.count());
         if (m_stop.left)
-            return false;
+            return std::nullopt;
     }
-    return true;
+    return std::nullopt;
 }
 
 void HttpSender::post(const QString& path) {

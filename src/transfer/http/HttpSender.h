@@ -67,7 +67,7 @@ public:
     SendingStop stop;
 
 private:
-    bool sendMissing(int attempt) override;
+    std::optional<SendingPhase> sendMissing(int attempt) override;
     std::optional<SendingPhase> checkArrival(int attempt) override;
     SendingPhase afterTheLast() override { return SendingPhase::NotAll; }
 

@@ -47,6 +47,8 @@ std::span<const PhaseLook> UploadForm::looks() const {
         PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {}, sendingTitle, reportingAdvice},
         PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
         PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
+        PhaseLook{
+            SendingPhase::CallLab, SendingSign::Bad, NewOrder, {NewOrder, Close}, notCompleteTitle, callLabAdvice},
         PhaseLook{SendingPhase::NotAll,
                   SendingSign::Bad,
                   SendAgain,
