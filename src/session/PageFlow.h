@@ -31,6 +31,10 @@ enum class Outcome {
     PiecesWanted, // a finished order is cut or joined
     PiecesDone,
     NewOrderWanted, // back to the start
+    PlainTakenUp,   // an unfinished preparation goes on, or an order is prepared again
+    EditedTakenUp,
+    SendingTakenUpByFtp, // an unfinished sending goes on
+    SendingTakenUpByHttp,
 };
 
 // One way through the program. A page that is left is unloaded; one that waits lies below the next.

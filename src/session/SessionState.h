@@ -194,6 +194,8 @@ struct HandOver {
     QStringList lines;
     bool pressStart = false; // the next page starts its work by itself once it is shown
     QString notice;          // a line for the customer that the start page shows
+    DrivePath takenUp;       // folder of the order whose preparation goes on; empty for a new order
+    DrivePath replaced;      // folder of the order that the next one is prepared again from
 };
 
 struct SessionState {
@@ -219,6 +221,7 @@ struct SessionState {
     bool SplitPage = false;              // the finished orders lead to the pieces, an operator's tool
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
     bool Careful = false;                // the guards of docs/guards.md are on
+    bool offerPutOff = false;            // the customer has put off the unfinished orders for this run
     bool OperatorArea = true;            // a customer may open the hidden area of the sending page
 
     ClientProfile profile;
