@@ -24,24 +24,38 @@ void Preparation::begin(const QStringList& lines) {
     count(m_lines);
 }
 
-bool Preparation::claimFolder(OrderFolder::Ending ending) {
+bool Preparation::claimFolder(OrderFolder::Ending ending, Sender by) {
+    if (const Result<void> ready = readyFolder(ending); !ready) {
+        m_events.notWritten(PreparationEvents::NotWritten::Folder, ready.failure());
+        return false;
+    }
+    const OrderState::Way way = m_state.TachanaMekomit ? OrderState::Way::Station
+                                : by == Sender::Http   ? OrderState::Way::Http
+                                                       : OrderState::Way::Ftp;
+    m_journal.emplace(m_platform.files, *m_folder);
+    keep(m_journal->begin(m_state, way, m_lines));
+    return true;
+}
+
+Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
     const Files& files = m_platform.files;
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
         for (const QString& name : files.names(m_folder->path(), u"*.jpp"_s))
             static_cast<void>(files.removeFile(m_folder->filePath(name)));
-        const Result<void> made = makeOrderFolder(files, *m_folder); // somebody may have removed it meanwhile
-        if (!made)
-            m_events.notWritten(PreparationEvents::NotWritten::Folder, made.failure());
-        return made.ok();
+        return makeOrderFolder(files, *m_folder); // somebody may have removed it meanwhile
     }
     const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
-    if (!claimed) {
-        m_events.notWritten(PreparationEvents::NotWritten::Folder, claimed.failure());
-        return false;
-    }
+    if (!claimed)
+        return claimed.failure();
     m_folder = *claimed;
     m_state.transfer.OrderFolder = claimed->path();
-    return true;
+    return {};
+}
+
+// An order without its state can be sent all the same; it only can't be taken up again.
+void Preparation::keep(const Result<void>& written) {
+    if (!written)
+        notWritten(written.failure());
 }
 
 bool Preparation::forEachPicture(const std::function<void(int)>& step) {
@@ -106,6 +120,7 @@ bool Preparation::writeLog(OrderLog::Layout layout) {
         return false;
     }
     m_state.transfer.OrderLogBase = m_folder->logBase();
+    keep(m_journal->prepared());
     return true;
 }
 

@@ -3,6 +3,7 @@
 #include "assembly/OrderSheet.h"
 #include "assembly/PrintPacker.h"
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 
 #include <QStringList>
@@ -55,8 +56,9 @@ public:
 protected:
     void begin(const QStringList& lines);
     // Claims a free number by making its folder, which the senders are told too. A second start keeps number and
-    // folder, less the print files of the first. False when the folder can't be made.
-    bool claimFolder(OrderFolder::Ending ending);
+    // folder, less the print files of the first. by: the sender that the order is made for. False when the folder can't
+    // be made.
+    bool claimFolder(OrderFolder::Ending ending, Sender by);
     // step(i) for each line, and the page painted behind each. False when a click ended the program.
     bool forEachPicture(const std::function<void(int)>& step);
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
@@ -77,7 +79,11 @@ protected:
     std::optional<OrderFolder> m_folder; // once it is claimed
 
 private:
-    QStringList m_failed; // paths of the pictures that could not be prepared
+    Result<void> readyFolder(OrderFolder::Ending ending);
+    void keep(const Result<void>& written);
+
+    std::optional<OrderJournal> m_journal; // of m_folder
+    QStringList m_failed;                  // paths of the pictures that could not be prepared
     int m_writeFailures = 0;
 };
 

@@ -35,7 +35,7 @@ void EditedPreparation::makeJobFolder() const {
 
 bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSize> paper) {
     begin(lines);
-    if (!claimFolder(OrderFolder::Ending::Plain))
+    if (!claimFolder(OrderFolder::Ending::Plain, m_state.transfer.SugSheliach))
         return false;
     PrintPacker packer(m_state, m_platform.files, *m_folder, OrderTail::shortWidth);
     {

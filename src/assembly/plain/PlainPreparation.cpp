@@ -100,7 +100,7 @@ std::optional<Bitmap> PlainPreparation::drawSheet(SheetKind kind, const QStringL
 bool PlainPreparation::prepare(const QStringList& lines) {
     begin(lines);
     // Before the sheet is drawn: it shows the number.
-    if (!claimFolder(OrderFolder::Ending::BySession))
+    if (!claimFolder(OrderFolder::Ending::BySession, Sender::Ftp))
         return false;
     const std::optional<Bitmap> drawn = drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain, m_lines);
     if (!drawn)
