@@ -271,7 +271,7 @@ void tFrmNew::undoAllEdits() {
     }
     ColourStep::undo(m_edit);
     // The reload may have changed the paper, so the centre is that of the new one.
-    putHandle(QPointF(PicPicSize.width / 2, PicPicSize.height / 2));
+    putHandle(QPoint(PicPicSize.width / 2, PicPicSize.height / 2));
     handleToFields();
     renderPackStore();
     showNumbers();
