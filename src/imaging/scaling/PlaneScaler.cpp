@@ -148,7 +148,7 @@ void PlaneScaler::rowsReady(int end) {
     const int taps = m_weights->rows.taps;
     const int have = std::min(end, m_down.source);
     while (m_outputEnd + m_blendedRows < m_down.target) {
-        const auto next = static_cast<std::size_t>(m_outputEnd + m_blendedRows);
+        const auto next = static_cast<std::size_t>(m_outputEnd) + static_cast<std::size_t>(m_blendedRows);
         const std::int16_t* weights = m_weights->rows.weights.data() + next * static_cast<std::size_t>(taps);
         const int first = m_weights->rows.first[next];
         int used = taps;

@@ -373,7 +373,7 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
         data.close();
     if (!moved) {
         // The server's own reason, if it still gives one, says more than a cut line: a full disk, a quota.
-        const Failure cut = moved.failure();
+        const Failure& cut = moved.failure();
         m_control.socket.setReceiveTimeout(std::min(m_call.limits().silence, Poco::Timespan(5, 0)));
         const Reply reason = readReply();
         m_control.socket.setReceiveTimeout(m_call.limits().silence);

@@ -5,6 +5,8 @@
 #include <QMouseEvent>
 #include <QScrollBar>
 
+#include <algorithm>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -80,8 +82,9 @@ void ScrolledPicture::mousePressEvent(QMouseEvent* event) {
 
 void ScrolledPicture::mouseMoveEvent(QMouseEvent* event) {
     const QPoint way = event->position().toPoint() - m_grabbed;
-    horizontalScrollBar()->setValue(m_from.x() - way.x() / m_theme.px(m_step));
-    verticalScrollBar()->setValue(m_from.y() - way.y() / m_theme.px(m_step));
+    const int step = std::max(1, m_theme.px(m_step));
+    horizontalScrollBar()->setValue(m_from.x() - way.x() / step);
+    verticalScrollBar()->setValue(m_from.y() - way.y() / step);
 }
 
 } // namespace lumora
