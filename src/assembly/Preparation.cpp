@@ -42,7 +42,7 @@ Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
         for (const QString& name : files.names(m_folder->path(), u"*.jpp"_s))
             static_cast<void>(files.removeFile(m_folder->filePath(name)));
-        return makeOrderFolder(files, *m_folder); // somebody may have removed it meanwhile
+        return makeOrderFolder(files, *m_folder); // it may have been removed meanwhile
     }
     const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
     if (!claimed)
@@ -60,7 +60,7 @@ void Preparation::keep(const Result<void>& written) {
 
 bool Preparation::forEachPicture(const std::function<void(int)>& step) {
     for (int i = 0; i < m_lines.size(); ++i) {
-        m_events.reached(PreparationStage::Pictures, i + 1);
+        m_events.packing(i + 1);
         step(i);
         if (!m_events.yield())
             return false;
@@ -95,10 +95,10 @@ std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& 
                                              const std::vector<SheetCell>& cells) {
     OrderSheet sheet(kind, orderSheetSize(kind, static_cast<int>(lines.size())), orderSheetBackground(kind, m_state));
     sheet.drawLines(texts);
-    m_events.reached(PreparationStage::Sheet, 0);
+    m_events.drawingSheet(0);
     bool goOn = true;
     sheet.drawContactSheet(cells, [&](int i) {
-        m_events.reached(PreparationStage::Sheet, i + 1);
+        m_events.drawingSheet(i + 1);
         return goOn = m_events.yield();
     });
     if (!goOn)
@@ -108,7 +108,7 @@ std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& 
 }
 
 void Preparation::countOrder() {
-    m_events.reached(PreparationStage::Closing, 0);
+    m_events.closing();
     if (const Result<void> counted = Workspace(m_state, m_platform.files).writeCounter(); !counted)
         m_events.notWritten(PreparationEvents::NotWritten::Counter, counted.failure());
 }

@@ -17,32 +17,32 @@ namespace lumora {
 struct Platform;
 struct SessionState;
 
-enum class PreparationStage { Waiting, Checking, Sheet, Pictures, Closing, Done };
-
-// What the preparation of an order tells the page in front of it.
+// What the preparation of an order tells its page.
 class PreparationEvents {
 public:
     enum class NotWritten { Folder, File, Counter, Log };
 
-    // position: of the picture in work, from 1; 0 before the first.
-    virtual void reached(PreparationStage stage, int position) = 0;
-    virtual void counted() = 0; // TotalPics of the session
+    // position: of the picture in work, from 1.
+    virtual void packing(int position) = 0;
+    virtual void drawingSheet(int position) = 0; // 0 before the first picture
+    virtual void closing() = 0;                  // the counter and the order log are written
+    virtual void counted() = 0;                  // TotalPics of the session
     virtual void inWork(const DrivePath& picture) = 0;
     virtual void printed(const Bitmap& /* small */) {}
     virtual void notPrepared(const DrivePath& picture) = 0;
-    // Of several files the first alone is told, and their number at the end.
+    // Of several File failures only the first; filesNotWritten() tells their number at the end.
     virtual void notWritten(NotWritten what, const Failure& failure) = 0;
     virtual void filesNotWritten(int count) = 0;
     virtual void sheetDrawn(const Bitmap& sheet) = 0;
-    // Lets the page paint and a click through. False when that click ended the program.
+    // Processes paint and input events. False when a click ended the program.
     virtual bool yield() = 0;
 
 protected:
     ~PreparationEvents() = default;
 };
 
-// Turns the lines of a basket into an order folder: print files, order sheet, order log and the next order's number.
-// What both kinds of order share; each kind has its own prepare().
+// What plain and edited orders share when the lines of a basket become an order folder: print files, order sheet, order
+// log and the next order's number. Each kind has its own prepare().
 class Preparation {
 public:
     Preparation(SessionState& state, const Platform& platform, PreparationEvents& events)
@@ -50,16 +50,16 @@ public:
         , m_platform(platform)
         , m_events(events) {}
 
-    // Sets the copies in all.
+    // Sets TotalPics, the sum of the copies.
     void count(const QStringList& lines);
 
 protected:
     void begin(const QStringList& lines);
-    // Claims a free number by making its folder, which the senders are told too. A second start keeps number and
-    // folder, less the print files of the first. by: the sender that the order is made for. False when the folder can't
+    // Claims a free order number by making its folder, and names that folder to the senders. A second start keeps both
+    // and removes the print files of the first. by: the sender that the order is made for. False when the folder can't
     // be made.
     bool claimFolder(OrderFolder::Ending ending, Sender by);
-    // step(i) for each line, and the page painted behind each. False when a click ended the program.
+    // Calls step(i) and yields for each line. False when a click ended the program.
     bool forEachPicture(const std::function<void(int)>& step);
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
     void notPrepared(const DrivePath& picture);
@@ -67,16 +67,16 @@ protected:
     // No value when a click ended the program.
     std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines, const QStringList& texts,
                                     const std::vector<SheetCell>& cells);
-    // The next order's number.
+    // Writes the next order's number.
     void countOrder();
-    // False when it can't be written: an order does not leave without its log.
+    // False when the log can't be written: an order is not sent without it.
     bool writeLog(OrderLog::Layout layout);
 
     SessionState& m_state;
     const Platform& m_platform;
     PreparationEvents& m_events;
     QStringList m_lines;
-    std::optional<OrderFolder> m_folder; // once it is claimed
+    std::optional<OrderFolder> m_folder; // set by claimFolder()
 
 private:
     Result<void> readyFolder(OrderFolder::Ending ending);

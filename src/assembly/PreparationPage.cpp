@@ -54,10 +54,9 @@ double PreparationPage::share() const {
     return m_count > 0 ? static_cast<double>(m_position) / m_count : 0;
 }
 
-void PreparationPage::reached(Stage stage, int position) {
-    if (stage == Stage::Pictures)
-        shared().List1.setCurrentIndex(position - 1);
-    setStage(stage, position);
+void PreparationPage::packing(int position) {
+    shared().List1.setCurrentIndex(position - 1);
+    setStage(Stage::Pictures, position);
 }
 
 void PreparationPage::inWork(const DrivePath& picture) {

@@ -49,24 +49,26 @@ protected:
 
     virtual PreparationControls& shared() = 0;
 
-    using Stage = PreparationStage;
+    enum class Stage { Waiting, Checking, Sheet, Pictures, Closing, Done };
 
-    // Takes the lines of the hand-over; answers whether the page before asks for the start.
+    // Takes the lines of the hand-over. True when the page before asks for the start.
     bool takeLines();
-    // False, with words, when there is nothing to prepare.
+    // False, and told, when there is nothing to prepare.
     bool somethingChosen();
     // The two lines of the warning not to delete the pictures yet.
     QString doNotDelete() const;
     QString untilPrinted() const;
 
-    // While it is on no button starts anything.
+    // No button starts anything while it is on.
     virtual void setPreparing(bool on);
     void setStage(Stage stage, int position = 0);
     // All sentences about progress, in the language of the session.
     virtual void showProgress();
 
-    // --- what the preparation tells ---
-    void reached(Stage stage, int position) override;
+    // What the preparation tells.
+    void packing(int position) override;
+    void drawingSheet(int position) override { setStage(Stage::Sheet, position); }
+    void closing() override { setStage(Stage::Closing); }
     void counted() override;
     void inWork(const DrivePath& picture) override;
     void notPrepared(const DrivePath& picture) override;
@@ -75,7 +77,7 @@ protected:
     void sheetDrawn(const Bitmap& sheet) override;
     bool yield() override;
 
-    // The order is whole. Follows the page flow to the sender; a local station keeps its orders.
+    // The order is complete: follows the page flow to the sender. A local station keeps its orders.
     void handOver(Outcome toSender);
     bool handedOver() const { return m_handedOver; }
     void leaveProgram();

@@ -37,7 +37,7 @@ void B3::setTexts() {
                              {Label4Title, u"הכנת תמונות למשלוח", u"Preparing your pictures"},
                              {Command1, u"הסר תמונה זו מהרשימה", u"Remove this picture from the list"},
                              {Command5, u"הכן את ההזמנה", u"Prepare the order"},
-                             // The same button in the two languages of the page.
+                             // One button for each language.
                              {Command2, u" Stop All and EXIT"},
                              {Command7, u"עצור המשלוח וצא מהתוכנה", u"Stop the sending and leave the program"},
                              {Picture5, u"דף ההזמנה", u"Order sheet"},
@@ -71,12 +71,15 @@ void B3::stopAndLeave() {
     leaveProgram();
 }
 
-void B3::reached(Stage stage, int position) {
-    if (stage == Stage::Pictures)
-        List2.setCurrentIndex(position - 1);
-    else if (stage == Stage::Sheet && position == 0)
+void B3::packing(int position) {
+    List2.setCurrentIndex(position - 1);
+    PreparationPage::packing(position);
+}
+
+void B3::drawingSheet(int position) {
+    if (position == 0)
         List1.setCurrentIndex(0);
-    PreparationPage::reached(stage, position);
+    PreparationPage::drawingSheet(position);
 }
 
 void B3::printed(const Bitmap& small) {

@@ -15,7 +15,7 @@ struct B3Controls : PreparationControls {
     Caption Label4Title{*this, u"Label4Title"}; // title of the page
     Caption Label1{*this, u"Label1"};           // the warning not to delete the pictures yet, two lines
     Caption Label2{*this, u"Label2"};
-    Caption Command1{*this, u"Command1", Caption::At::Hidden};
+    Caption Command1{*this, u"Command1", Caption::At::Hidden}; // removes a picture from the list; never visible
     Caption Command2{*this, u"Command2"};
     Caption Command5{*this, u"Command5"};
     Caption Command7{*this, u"Command7"};
@@ -24,7 +24,7 @@ struct B3Controls : PreparationControls {
 
 // Preparing an edited order ("B3" in the glossary): the customer waits while each picture is rendered with all that its
 // record says and packed into a print file of the order folder; the order sheet is drawn from the rendered prints. The
-// page takes the lines of the hand-over when it loads and starts by itself once it was seen for two seconds.
+// page takes the lines of the hand-over when it loads and starts by itself two seconds later.
 class B3 : public PreparationPage, private B3Controls {
     Q_OBJECT
 public:
@@ -39,7 +39,6 @@ public:
     void Command5_Click() { prepare(); }
     void Command2_Click() { stopAndLeave(); }
     void Command7_Click() { stopAndLeave(); }
-    void Command1_Click() {} // a button that does nothing; it is not shown
 
     // State
     const B3Controls& controls() const override { return *this; }
@@ -52,7 +51,8 @@ private:
     void setPreparing(bool on) override;
     void prepare();
     void stopAndLeave();
-    void reached(Stage stage, int position) override;
+    void packing(int position) override;
+    void drawingSheet(int position) override;
     void printed(const Bitmap& small) override;
     void sheetDrawn(const Bitmap& sheet) override;
 

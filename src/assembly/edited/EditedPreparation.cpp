@@ -46,7 +46,7 @@ bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSiz
     countOrder();
     if (!drawSheet())
         return false;
-    m_events.reached(PreparationStage::Closing, 0);
+    m_events.closing();
     return writeLog(OrderLog::Layout::Edited);
 }
 

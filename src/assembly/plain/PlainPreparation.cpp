@@ -22,7 +22,7 @@ BasketLine split(const QString& line) {
     return BasketLine::split(line, LineForm::Short);
 }
 
-// Either spelling of the camera and no other: what else there is was picked with a whole folder.
+// Cameras write one of these two spellings; other files come with a folder that was added whole.
 bool isJpegItem(const QString& item) {
     const QString ending = item.right(3);
     return ending == u"JPG" || ending == u"jpg";
@@ -30,8 +30,8 @@ bool isJpegItem(const QString& item) {
 
 } // namespace
 
-// The prints of the order, scaled ahead of the step that packs them; only a source path goes into that work and only
-// bytes come out.
+// The prints of the order, scaled on other threads ahead of the step that packs them. That work takes a source path and
+// gives bytes; it shares no state with the page.
 class PlainPreparation::Prints {
 public:
     Prints(const SessionState& state, const Files& files, const QStringList& items)
@@ -40,7 +40,6 @@ public:
         , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items))
         , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
 
-    // The print of the next picture that is to be scaled.
     template <class Waiting>
     Result<QByteArray> next(Waiting whileWaiting) {
         return m_prints.take(whileWaiting);
@@ -99,7 +98,7 @@ std::optional<Bitmap> PlainPreparation::drawSheet(SheetKind kind, const QStringL
 
 bool PlainPreparation::prepare(const QStringList& lines) {
     begin(lines);
-    // Before the sheet is drawn: it shows the number.
+    // The sheet shows the number.
     if (!claimFolder(OrderFolder::Ending::BySession, Sender::Ftp))
         return false;
     const std::optional<Bitmap> drawn = drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain, m_lines);
@@ -124,7 +123,7 @@ void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& print
     packer.beginStep();
     if (!line.hasUsableName())
         return;
-    // What the selection page leaves of a name that the code page can't carry.
+    // The selection page writes a question mark for a character that the code page lacks.
     if (HasQuestionMark(m_lines[index])) {
         notPrepared(line.path);
         return;

@@ -11,8 +11,8 @@ class PlainPreparation : public Preparation {
 public:
     using Preparation::Preparation;
 
-    // Moves what is no JPEG to removed. The walk steps on after a removal, so that the line behind a removed one is not
-    // looked at until the next walk: the lab knows the lists that come of it.
+    // Moves the lines that name no JPEG file to removed. A walk passes over the line behind a removed one, which the
+    // next walk reads.
     static void keepOnlyJpeg(TextList& lines, TextList& removed);
 
     bool isAlbum() const;

@@ -13,6 +13,7 @@ struct SendingControls : Controls {
     Caption Label4File{*this, u"Label4File"};                          // "file 3 of 12"; empty while no file is sent
     Caption Label4Reason{*this, u"Label4Reason", Caption::At::Hidden}; // what the last failure means
     Caption Label4Order{*this, u"Label4Order"};                        // heading of the order's card
+    Caption Pic4Order{*this, u"Pic4Order"};                            // card of the order
     Caption Pic4Failure{*this, u"Pic4Failure", Caption::At::Hidden};   // card of the failure, at the end
     Caption Command28{*this, u"Command28", Caption::At::Hidden};       // new order
     Caption Image3{*this, u"Image3"};                                  // close

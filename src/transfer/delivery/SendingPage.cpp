@@ -97,13 +97,15 @@ SendingGauge SendingPage::gauge() const {
 }
 
 void SendingPage::tellReason(LineStep step, const Failure& failure, const QString& subject) {
-    m_shown.Label4Reason.text = LineTroubleText(m_state, step, failure, subject);
+    m_reason = LineTroubleText(m_state, step, failure, subject);
+    m_shown.Label4Reason.text = m_reason;
     m_shown.Label4Reason.hint = failure.message;
     m_shown.Label4Reason.visible = true;
     Q_EMIT changed();
 }
 
 void SendingPage::forgetReason() {
+    m_reason.clear();
     m_shown.Label4Reason.text.clear();
     m_shown.Label4Reason.visible = false;
 }

@@ -55,6 +55,7 @@ protected:
     void tellPhase();
     void tellReason(LineStep step, const Failure& failure, const QString& subject);
     void forgetReason();
+    const QString& reason() const { return m_reason; } // empty: no failure is to be told
     void leaveForNewOrder();
     void leaveProgram();
 
@@ -73,6 +74,7 @@ private:
     SendingControls& m_shown;
     SendingPhase m_phase = SendingPhase::Preparing;
     bool m_activated = false;
+    QString m_reason; // what the last failure means
 };
 
 } // namespace lumora

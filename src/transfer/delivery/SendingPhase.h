@@ -37,8 +37,8 @@ enum class SendingButton {
     None = 0,
     SendNow = 1,
     SendAgain = 2,
-    Hold = 4, // stops the count; by FTP a second press starts it again
-    GoOn = 8,
+    Hold = 4, // stops the count
+    GoOn = 8, // starts it again
     Stop = 16,
     NewOrder = 32,
     Close = 64,

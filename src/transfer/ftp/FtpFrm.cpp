@@ -41,7 +41,6 @@ void FtpFrm::load() {
 }
 
 void FtpFrm::begin() {
-    AllDone = 0;
     if (m_state.KodMishloach == u"HOM"_s) {
         Label15.visible = Label4Ktovet.visible = true;
         Label4Ktovet.text = m_state.shemot.n3;
@@ -95,10 +94,7 @@ void FtpFrm::countSecond() {
     if (!over)
         return;
     stopTimers();
-    if (Pic4Quik.visible)
-        sendChain();
-    else
-        sendOrder();
+    sendOrder();
 }
 
 void FtpFrm::blink() {
@@ -171,15 +167,14 @@ void FtpFrm::showFailure() {
     Label2.visible = true;
     Label9.visible = true;
     Image6.visible = true;
-    Label4Reason.visible = false; // Label2 says the same
-    Label2.text = Label4Reason.text.isEmpty()
+    Label2.text = reason().isEmpty()
                       ? wording(u"חלק מהקבצים לא הגיעו לשרת.", u"Some of the files did not arrive at the server.")
-                      : Label4Reason.text;
+                      : reason();
+    forgetReason(); // Label2 shows it
     showSecondsAfterFailure();
 }
 
 void FtpFrm::succeed() {
-    AllDone = 1;
     enter(SendingPhase::Reporting);
     for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
         control->visible = false;

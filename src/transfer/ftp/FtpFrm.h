@@ -78,6 +78,7 @@ public:
     const FtpSender& sender() const { return m_sender; }
     const FileList& files() const { return File1; }
     bool counting() const { return Timer1.running(); }
+    std::int16_t AllDone() const { return phase() == SendingPhase::Success ? 1 : 0; }
 
     // The signal is Page::changed().
 
@@ -121,6 +122,7 @@ private:
     QString advice(const PhaseLook& row) const override;
     void showPhase(const PhaseLook& row) override;
     void showMinutes();
+    void showFileCount(int files);
     void showCounts();
     void showAttempt(int attempt);
     void showStoppedBoxes();
@@ -169,6 +171,10 @@ private:
     Ticker Timer2; // 500 ms: the blinking
     FtpSender m_sender;
     QStringList m_handedOver; // paths from the page of finished orders
+    int m_fileCount = 0;      // files found in the folder
+    std::optional<int> m_printCount;
+    std::optional<int> m_minutesLeft; // known from the second piece on
+    bool m_incomplete = false;        // the pass has left files behind
     // Command26 shows the proof picture if a page has set both; none does.
     bool m_proofWanted = false;
     QString m_proofText;

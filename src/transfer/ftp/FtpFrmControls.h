@@ -14,7 +14,6 @@ struct FtpFrmControls : SendingControls {
         Small, // a narrow strip while files are sent, so that the customer can use the screen
     };
     PageSize pageSize = PageSize::Full;
-    std::int16_t AllDone = 0; // 1 after success
 
     // Label3 is the status line in the system's terms; Label4Do tells the same to a customer.
     Caption Label3{*this, u"Label3"};
@@ -89,7 +88,7 @@ struct FtpFrmControls : SendingControls {
     Caption Frame5{*this, u"Frame5"};
     Caption Label6{*this, u"Label6"};
     Caption Label8{*this, u"Label8"};
-    Caption Pic4Quik{*this, u"Pic4Quik", Caption::At::Hidden}; // never visible
+    Caption Pic4Quik{*this, u"Pic4Quik", Caption::At::Hidden}; // a chain follows the countdown; never visible
 
     // The lab's own area: the lists and the manual panel.
     Caption Frame2{*this, u"Frame2", Caption::At::Hidden};

@@ -96,10 +96,11 @@ void FtpFrm::reached(SendingMoment moment, int number) {
         enter(SendingPhase::Checking);
         break;
     case SendingMoment::PassBegins:
+        m_incomplete = false;
         Picture6.visible = Frame9.visible = Image6.visible = false;
         break;
     case SendingMoment::PassEnds:
-        Label4Diff.text = u"0"_s;
+        m_minutesLeft = 0;
         showMinutes();
         break;
     case SendingMoment::Incomplete:
@@ -167,7 +168,7 @@ void FtpFrm::reached(SendingMoment moment, int number) {
 }
 
 void FtpFrm::showIncomplete(int missing) {
-    Picture6.visible = true;
+    m_incomplete = Picture6.visible = true;
     Label12.text = QString::number(m_sender.NumToSend);
     Label31.text = QString::number(lists().List9.count());
     Label4Missing.text = QString::number(missing);
@@ -205,7 +206,7 @@ void FtpFrm::sending(int index, int count, const QString& name) {
 void FtpFrm::pieceSent(double share, std::optional<int> minutes) {
     PicInProgKatanWidth = static_cast<int>(share * Pic4ProgWidth);
     if (minutes)
-        Label4Diff.text = QString::number(*minutes);
+        m_minutesLeft = minutes;
     showMinutes();
     Q_EMIT changed();
 }

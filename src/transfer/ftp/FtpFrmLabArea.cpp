@@ -11,7 +11,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 void FtpFrm::refillAndSendInRounds() {
-    if (isUnderWay(phase()) || AllDone == 1)
+    if (isUnderWay(phase()) || phase() == SendingPhase::Success)
         return;
     // List3 would get the proof picture alone, and its arrival would count as that of the order.
     if (m_handedOver.isEmpty()) {
@@ -27,7 +27,7 @@ void FtpFrm::refillAndSendInRounds() {
 }
 
 void FtpFrm::sendInRounds() {
-    if (isUnderWay(phase()) || AllDone == 1 || m_sender.stop.left)
+    if (isUnderWay(phase()) || phase() == SendingPhase::Success || m_sender.stop.left)
         return;
     if (lists().List3.isEmpty()) {
         m_platform.dialogs.message(u"list3 is empty"_s);
@@ -71,7 +71,6 @@ void FtpFrm::SendChainOrder(const QString& name) {
         countPictures();
         m_sender.beginOrder();
         m_state.transfer.ShemTikiya = name;
-        AllDone = 0;
         m_sender.check.ListServerFiles();
         m_sender.check.DropAlreadySent();
         end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();

@@ -42,12 +42,12 @@ void FtpFrm::listFolder() {
     clearLists();
     File1Index = -1;
     if (!order.isChosen()) {
-        Label7.text = u"0"_s;
+        showFileCount(0);
         return;
     }
     File1.setFolder(order.path());
     File1.refresh();
-    Label7.text = QString::number(File1.count());
+    showFileCount(File1.count());
     ReadOrderDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
     m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, order, File1.names(), inPieces()));
@@ -66,7 +66,7 @@ void FtpFrm::countPictures() {
     for (const QString& path : lists().List3.items())
         names.append(LeafName(path));
     m_state.shemot.TotalPics = sumOfCopies(names.items(), CopiesIn::FileNames);
-    Label21.text = QString::number(m_state.shemot.TotalPics);
+    m_printCount = m_state.shemot.TotalPics;
     showCounts();
 }
 
@@ -110,13 +110,13 @@ void FtpFrm::beginResend() {
     m_chain.unload(PageId::MoogMeret);
     const OrderFolder order = OrderFolder::chosen(m_state);
     if (!order.isChosen()) {
-        Label7.text = u"0"_s;
+        showFileCount(0);
         enter(SendingPhase::NoOrder);
         return;
     }
     FtpLists& lists = m_sender.lists;
     lists.List3.append(m_handedOver);
-    Label7.text = QString::number(lists.List3.count());
+    showFileCount(lists.List3.count());
     ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
     addProofPicture();

@@ -39,7 +39,7 @@ std::span<const PhaseLook> FtpFrm::looks() const {
         PhaseLook{SendingPhase::Waiting,
                   SendingSign::Seconds,
                   SendNow,
-                  {SendNow, Hold},
+                  {SendNow, GoOn},
                   sendingTitle,
                   {u"הספירה נעצרה. כדי לשלוח יש ללחוץ על הלחצן שלח עכשיו.",
                    u"The count is stopped. Press Send now to send."}},
@@ -102,20 +102,21 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Command15.enabled = Command21.enabled = underWay && row.phase != SendingPhase::Reporting;
     Command15.visible = row.buttons.testFlag(Stop);
     Image5.visible = row.buttons.testFlag(SendNow);
-    Command23.visible = row.buttons.testFlag(Hold);
+    Command23.visible = row.buttons.testAnyFlags(SendingButtons(Hold) | GoOn);
     Command10.visible = row.buttons.testFlag(SendAgain);
     Command11.visible = Command11.enabled = row.buttons.testFlag(Close);
-    Command23.text =
-        row.phase == SendingPhase::Waiting ? wording(u"המשך", u"Go on") : wording(u"עצור משלוח", u"Stop sending");
+    Command23.text = row.buttons.testFlag(GoOn) ? wording(u"המשך", u"Go on") : wording(u"עצור משלוח", u"Stop sending");
     PicInProgKatan.visible = underWay && inPieces();
-    Pic4Failure.visible = ended && (Picture6.visible || Label4Reason.visible);
+    Pic4Failure.visible = ended && (m_incomplete || !reason().isEmpty());
+    Pic4Order.visible = row.phase != SendingPhase::Success; // Picture2 stands in its place
     showMinutes();
 }
 
-// The minutes are known from the second piece on.
 void FtpFrm::showMinutes() {
+    if (m_minutesLeft)
+        Label4Diff.text = QString::number(*m_minutesLeft);
     Label4Diff.visible = Label4DiffTitle.visible = Label4Minutes.visible =
-        isUnderWay(phase()) && inPieces() && !Label4Diff.text.isEmpty();
+        isUnderWay(phase()) && inPieces() && m_minutesLeft;
 }
 
 void FtpFrm::setTexts() {
@@ -177,10 +178,18 @@ void FtpFrm::setTexts() {
     Q_EMIT changed();
 }
 
+void FtpFrm::showFileCount(int files) {
+    m_fileCount = files;
+    Label7.text = QString::number(files);
+}
+
 void FtpFrm::showCounts() {
-    const QString prints = Label21.text.trimmed();
-    Label4Counts.visible = Label4Prints.visible = !prints.isEmpty();
-    Label4Counts.text = wording(u"%1 תמונות, %2 קבצים", u"%1 prints, %2 files").arg(prints, Label7.text.trimmed());
+    Label4Counts.visible = Label4Prints.visible = m_printCount.has_value();
+    if (!m_printCount)
+        return;
+    const QString prints = QString::number(*m_printCount);
+    Label21.text = prints;
+    Label4Counts.text = wording(u"%1 תמונות, %2 קבצים", u"%1 prints, %2 files").arg(prints).arg(m_fileCount);
     Label4Prints.text = wording(u"תמונות בהזמנה: %1", u"Prints in this order: %1").arg(prints);
 }
 

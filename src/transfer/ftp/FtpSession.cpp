@@ -73,7 +73,7 @@ void FtpSession::log(const QString& text) {
     m_lists.LogList.append(QString::number(now.hour()) + QString::number(now.minute()) + text);
 }
 
-// What a stop has cut is no trouble.
+// A call that the customer's stop has cut is not told as a failure.
 void FtpSession::trouble(LineStep step, const Failure& failure, const QString& subject) {
     if (!m_stop.StopFlag && !m_stop.left)
         m_events.failed(step, failure, subject);

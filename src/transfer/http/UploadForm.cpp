@@ -52,7 +52,6 @@ void UploadForm::startPanel() {
     Picture1.visible = Pic4Timer.visible = Picture5.visible = true;
     Picture1Width = 1;
     m_countdown.restart();
-    Label11.visible = false;
     Timer1.start();
     enter(SendingPhase::Countdown);
 }
@@ -92,7 +91,6 @@ void UploadForm::findMissing() {
         startPanel();
         return;
     }
-    Label11.visible = true;
     Pic4Timer.visible = Image4.visible = Picture5.visible = false;
     Picture1.visible = true;
     stopTimers();
@@ -134,7 +132,7 @@ void UploadForm::countSecond() {
 }
 
 void UploadForm::stopCount() {
-    if (!idle() || !Command3.visible)
+    if (!idle() || phase() != SendingPhase::Countdown)
         return;
     stopTimers();
     Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
@@ -167,6 +165,7 @@ void UploadForm::sendMissing() {
         succeed();
         return;
     }
+    m_attemptFailed = true;
     Label1.text = wording(u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
                           u"After three attempts the computer could not upload the whole order");
     enter(*end);
@@ -178,7 +177,8 @@ void UploadForm::succeed() {
     caption = u"100%"_s;
     PicSargel1Width = PicSargel2Width;
     Label1.text.clear();
-    Label4Reason.visible = false;
+    m_attemptFailed = false;
+    forgetReason();
     enter(SendingPhase::Reporting);
     m_sender.HttpPause(2);
     if (m_state.transfer.SugMishloah == Sending::NewOrder && !m_sender.stop.left) {
@@ -190,7 +190,7 @@ void UploadForm::succeed() {
         return;
     Label9.visible = Pic4Hamten.visible = Picture1.visible = false;
     Picture6.visible = true;
-    Label16.text = Label15.text;
+    Label16.text = m_orderName;
     enter(SendingPhase::Success);
 }
 

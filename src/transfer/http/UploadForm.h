@@ -112,7 +112,8 @@ private:
     void showPhase(const PhaseLook& row) override;
     void showCount();
     void showTrouble();
-    void showLeft(int files);
+    void showLeft();
+    void showOrder();
     void showAnswers();
 
     // UploadFormUnused.cpp
@@ -132,7 +133,10 @@ private:
     Ticker Timer1; // 1 ms: the panel grows
     Ticker Timer2; // 1000 ms: the countdown
     HttpSender m_sender;
-    bool m_busy = false; // a check outside an attempt runs
+    bool m_busy = false;          // a check outside an attempt runs
+    bool m_attemptFailed = false; // an attempt of this sending has left files behind
+    std::optional<int> m_left;    // files that have not arrived, once they are counted
+    QString m_orderName;          // as the server was asked for it
 };
 
 } // namespace lumora

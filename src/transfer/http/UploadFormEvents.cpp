@@ -3,6 +3,8 @@
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
 
+#include <algorithm>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -10,12 +12,15 @@ using namespace Qt::StringLiterals;
 void UploadForm::reached(SendingMoment moment, int number) {
     switch (moment) {
     case SendingMoment::AttemptBegins:
-        Label1.text = number == 1 ? QString()
-                                  : wording(u"שולח קבצים שלא עלו כראוי", u"Sending files that did not go up properly");
+        m_attemptFailed = number > 1;
+        Label1.text = m_attemptFailed
+                          ? wording(u"שולח קבצים שלא עלו כראוי", u"Sending files that did not go up properly")
+                          : QString();
         Picture6.visible = false;
         Label10.text = m_state.profile.LabPhone;
-        Label4Tel.text = wording(u"טלפון החנות: %1", u"The shop's telephone: %1").arg(Label10.text.trimmed());
-        Label4Tel.visible = !Label10.text.trimmed().isEmpty();
+        Label4Tel.text =
+            wording(u"טלפון החנות: %1", u"The shop's telephone: %1").arg(m_state.profile.LabPhone.trimmed());
+        Label4Tel.visible = !m_state.profile.LabPhone.trimmed().isEmpty();
         PicSargel1Width = 1;
         percent = 0;
         Label7.text = u"0"_s;
@@ -31,10 +36,12 @@ void UploadForm::reached(SendingMoment moment, int number) {
         break;
     case SendingMoment::Posted:
     case SendingMoment::Missing:
-        showLeft(number);
+        m_left = number;
+        showLeft();
         break;
     case SendingMoment::Answered:
-        Label15.text = OrderFolder::chosen(m_state).name();
+        m_orderName = OrderFolder::chosen(m_state).name();
+        showOrder();
         showAnswers();
         break;
     default:
@@ -50,13 +57,12 @@ void UploadForm::sending(int index, int count, const QString& name) {
 
 void UploadForm::progressed(int index, int count) {
     Label4.text = QString::number(index);
-    if (count > 0) {
-        const double share = index * 100.0 / count;
-        Label7.text = QString::number(share).left(3);
-        percent = static_cast<int>(share);
-        PicSargel1Width = static_cast<int>(PicSargel2Width * share / 100);
-    }
-    caption = Label7.text + u" %   "_s +
+    const double share = index * 100.0 / std::max(count, 1);
+    const QString number = QString::number(share).left(3);
+    Label7.text = number;
+    percent = static_cast<int>(share);
+    PicSargel1Width = static_cast<int>(PicSargel2Width * share / 100);
+    caption = number + u" %   "_s +
               wording(u"נא לא לסגור עד גמר המשלוח", u"Please do not close until the end of the sending");
     Q_EMIT changed();
 }

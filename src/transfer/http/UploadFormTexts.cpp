@@ -9,6 +9,15 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+constexpr SendingWords allWentUp{u"הזמנה זו עלתה במלואה", u"This order went up in full"};
+constexpr SendingWords startsIn{u" המשלוח יחל בעוד ", u"The sending starts in"};
+constexpr SendingWords secondsWord{u"שניות", u"seconds"};
+constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "};
+
+} // namespace
+
 // The page never enters Stopped or Unclear.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
@@ -67,30 +76,40 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Command3.visible = row.buttons.testFlag(Hold);
     Command10.visible = row.buttons.testFlag(GoOn);
     endClose.visible = row.buttons.testFlag(Close);
+    Label11.visible = row.phase == SendingPhase::AllThere;
     showCount();
     showTrouble();
-    Label4Left.visible = !Label12.text.isEmpty() && !hasArrived(row.phase);
+    showLeft();
+    showOrder();
 }
 
 void UploadForm::showCount() {
-    Label8.text = QString::number(countdown().seconds());
-    Label4Count.visible = phase() == SendingPhase::Countdown || Label11.visible;
-    Label4Count.text = phase() == SendingPhase::Countdown
-                           ? Label13.text.trimmed() + u' ' + Label8.text + u' ' + Label14.text.trimmed()
-                           : Label11.text;
+    const bool counts = phase() == SendingPhase::Countdown;
+    const QString seconds = QString::number(countdown().seconds());
+    Label8.text = seconds;
+    Label4Count.visible = counts || phase() == SendingPhase::AllThere;
+    Label4Count.text =
+        counts ? wording(startsIn).trimmed() + u' ' + seconds + u' ' + wording(secondsWord) : wording(allWentUp);
 }
 
 // A failure during the sending is shown without alarm; at the end it explains why the order was not sent.
 void UploadForm::showTrouble() {
-    const bool told = !Label1.text.isEmpty() || Label4Reason.visible;
+    const bool told = m_attemptFailed || !reason().isEmpty();
     Pic4Trouble.visible = told && isUnderWay(phase());
     Pic4Failure.visible = told && look().sign == SendingSign::Bad;
 }
 
-void UploadForm::showLeft(int files) {
-    Label12.text = QString::number(files);
-    Label4Left.text = Label4Notru.text.trimmed() + u": "_s + Label12.text;
-    Label4Left.visible = !hasArrived(phase());
+void UploadForm::showLeft() {
+    const QString files = m_left ? QString::number(*m_left) : QString();
+    Label12.text = files;
+    Label4Left.text = wording(filesLeft).trimmed() + u": "_s + files;
+    Label4Left.visible = m_left && !hasArrived(phase());
+}
+
+// After success the end panel stands in the place of the order's card.
+void UploadForm::showOrder() {
+    Label15.text = m_orderName;
+    Pic4Order.visible = !m_orderName.isEmpty() && phase() != SendingPhase::Success;
 }
 
 void UploadForm::showAnswers() {
@@ -108,14 +127,13 @@ void UploadForm::setTexts() {
                           {endClose, u"סגור", u"Close"},
                           {Image5, u"שלח שוב", u"Send again"},
                           {Label9, u"שולח", u"Sending"},
-                          {Label11, u"הזמנה זו עלתה במלואה", u"This order went up in full"},
-                          {Label13, u" המשלוח יחל בעוד ", u"The sending starts in"},
-                          {Label14, u"שניות", u"seconds"},
-                          {Label4Notru, u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "},
+                          {Label11, allWentUp.hebrew, allWentUp.english},
+                          {Label13, startsIn.hebrew, startsIn.english},
+                          {Label14, secondsWord.hebrew, secondsWord.english},
+                          {Label4Notru, filesLeft.hebrew, filesLeft.english},
                           {Label4Rshom, u"נא לרשום את מספר ההזמנה ", u"Please write down the order number"},
                           {Label4Alu, u" הקבצים עלו בהצלחה ", u"The files went up successfully"},
                           {Label4Tashlum, u"נא להתקשר לחנות לגבי תשלום", u"Please call the shop about payment"}});
-    Label4Left.text = Label4Notru.text.trimmed() + u": "_s + Label12.text;
     tellPhase();
     Q_EMIT changed();
 }

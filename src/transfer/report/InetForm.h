@@ -23,8 +23,6 @@ public:
     // Events.
     void Command1_Click() { reportOrder(); }
     void Command2_Click() { reportDone(); }
-    void Command4_Click() {} // "pricelist"
-    void cmdLoad_Click() {}  // "Load"
 
     void reportOrder();
     void reportDone();

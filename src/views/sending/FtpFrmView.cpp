@@ -51,7 +51,7 @@ void FtpFrmView::makeProgress() {
 
 QLayout* FtpFrmView::makeSide() {
     const Card order = makeCard("card", Pad::Normal);
-    m_order = order.frame;
+    bind(order.frame, c.Pic4Order);
     add(*order.column, {label(c.Label4Order, "smallMuted"),
                         orderName(c.Label46, "strong"),
                         label(c.Label4Counts),
@@ -73,7 +73,7 @@ QLayout* FtpFrmView::makeSide() {
     bind(m_proof, c.Picture13);
     QPushButton* fault = button(c.Command22, Role::Plain, &FtpFrm::Command22_Click, u"resend"_s);
     QPushButton* details = button(c.Command24, Role::Quiet, &FtpFrm::Command24_Click, u"info"_s);
-    return inColumn(Space::Normal, {m_order,
+    return inColumn(Space::Normal, {order.frame,
                                     delivery.frame,
                                     summary.frame,
                                     {m_proof, 1},
@@ -134,7 +134,6 @@ void FtpFrmView::render() {
     m_pieces->setVisible(c.PicInProgKatan.visible);
     m_pieces->setValue(c.PicInProgKatanWidth);
     m_pieces->setAccessibleName(c.PicInProgKatan.text);
-    m_order->setVisible(m_page.phase() != SendingPhase::Success);
     QStringList lines;
     for (const QString& line : c.Picture2Lines) {
         if (!line.trimmed().isEmpty())
@@ -143,7 +142,7 @@ void FtpFrmView::render() {
     m_summary->setText(lines.join(u'\n'));
     if (std::exchange(m_proofFile, c.Picture13File) != c.Picture13File)
         m_proof->setPicture(loadedPicture(m_files, m_proofFile));
-    setIcon(m_count, m_page.phase() == SendingPhase::Countdown ? u"pause"_s : u"play"_s, Theme::Colour::Ink);
+    setIcon(m_count, m_page.look().buttons.testFlag(SendingButton::GoOn) ? u"play"_s : u"pause"_s, Theme::Colour::Ink);
     m_leave->setOpen(c.Picture7.visible);
     m_labArea->setOpen(c.Frame2.visible);
 }

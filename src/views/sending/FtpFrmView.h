@@ -28,7 +28,6 @@ private:
 
     const Files& m_files;
     QProgressBar* m_pieces = nullptr;
-    QFrame* m_order = nullptr;
     QLabel* m_summary = nullptr;
     PictureBox* m_proof = nullptr;
     DrivePath m_proofFile;

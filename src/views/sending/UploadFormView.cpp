@@ -6,7 +6,7 @@ using namespace Qt::StringLiterals;
 
 UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme) {
-    // The same words in two dresses: on the way they are no reason to worry.
+    // Both cards show the same words: the first during the sending, which goes on, the second at the end.
     const Card trouble = makeSignedCard("notice", u"resend"_s, Theme::Colour::Ink);
     add(*trouble.column, {echo(c.Label1, "strong"), echo(c.Label4Reason)});
     bind(trouble.frame, c.Pic4Trouble);
@@ -22,7 +22,7 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
 
 QLayout* UploadFormView::makeSide() {
     const Card order = makeCard("card", Pad::Normal);
-    m_order = order.frame;
+    bind(order.frame, c.Pic4Order);
     add(*order.column,
         {label(c.Label4Order, "smallMuted"), orderName(c.Label15, "strong"), label(c.Label4Left), label(c.Label4Tel)});
     const Card end = makeCard("notice", Pad::Normal);
@@ -30,7 +30,7 @@ QLayout* UploadFormView::makeSide() {
     add(*end.column, {label(c.Label4Alu, "large"), label(c.Label4Rshom), orderName(c.Label16, "large"),
                       label(c.Label4Tashlum), echo(c.Label4Tel, "large")});
     QPushButton* refresh = button(c.Command2, Role::Quiet, &UploadForm::Command2_Click, u"resend"_s);
-    return inColumn(Space::Normal, {m_order, end.frame, Item::room(), {refresh, 0, Qt::AlignLeading}});
+    return inColumn(Space::Normal, {order.frame, end.frame, Item::room(), {refresh, 0, Qt::AlignLeading}});
 }
 
 void UploadFormView::makeBars() {
@@ -43,11 +43,6 @@ void UploadFormView::makeBars() {
     frame().addMainActions(
         {asMain(SendingButton::NewOrder, button(c.Command28, Role::Secondary, &UploadForm::Command28_Click)),
          asMain(SendingButton::GoOn, goOn), asMain(SendingButton::SendAgain, again)});
-}
-
-void UploadFormView::render() {
-    SendingView::render();
-    m_order->setVisible(!c.Label15.text.isEmpty() && !c.Picture6.visible);
 }
 
 } // namespace lumora

@@ -11,14 +11,10 @@ public:
     UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override { return m_stop; }
 
-protected:
-    void render() override;
-
 private:
     QLayout* makeSide();
     void makeBars();
 
-    QFrame* m_order = nullptr;
     QPushButton* m_stop = nullptr;
 };
 
