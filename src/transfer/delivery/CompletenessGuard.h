@@ -1,0 +1,32 @@
+#pragma once
+
+#include <QStringList>
+
+namespace lumora {
+
+class OrderFolder;
+struct OrderCompleteness;
+struct Platform;
+struct SessionState;
+
+// Asked before a sending begins: an order without a picture to print does not leave, and one that lacks pictures of its
+// log leaves only if the customer says so. As built in, every order leaves.
+class CompletenessGuard {
+public:
+    CompletenessGuard(const SessionState& state, const Platform& platform)
+        : m_state(state)
+        , m_platform(platform) {}
+
+    // names: leaf names of the files that would be sent. Shows a message or a question, whose loop may close the page.
+    bool maySend(const OrderFolder& folder, const QStringList& names) const;
+
+private:
+    // The words, in CompletenessGuardTexts.cpp.
+    void tellNoPicture() const;
+    bool askForFewer(const OrderCompleteness& counts) const;
+
+    const SessionState& m_state;
+    const Platform& m_platform;
+};
+
+} // namespace lumora

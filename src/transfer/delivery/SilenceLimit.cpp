@@ -1,0 +1,44 @@
+#include "transfer/delivery/SilenceLimit.h"
+
+#include "session/SessionState.h"
+
+namespace lumora {
+
+namespace {
+
+constexpr int mostSilentFiles = 2;
+constexpr qint64 window = 300;               // seconds
+constexpr qint64 leastBytes = window * 1000; // in a window
+// Behind a longer gap the machine has slept or its clock was set.
+constexpr qint64 longestGap = 60; // seconds
+
+} // namespace
+
+void SilenceLimit::begin() {
+    m_samples.clear();
+    m_silentFiles = 0;
+    m_tooSlow = false;
+}
+
+void SilenceLimit::connectsTimedOut(bool all) {
+    m_silentFiles = all ? m_silentFiles + 1 : 0;
+}
+
+void SilenceLimit::moved(qint64 bytes, const QDateTime& now) {
+    if (!m_samples.empty()) {
+        const qint64 gap = m_samples.back().time.secsTo(now);
+        if (gap < 0 || gap > longestGap)
+            m_samples.clear();
+    }
+    m_samples.push_back({now, bytes});
+    while (m_samples.size() > 1 && m_samples[1].time.secsTo(now) >= window)
+        m_samples.pop_front();
+    const Sample& then = m_samples.front();
+    m_tooSlow = m_tooSlow || (then.time.secsTo(now) >= window && bytes - then.bytes < leastBytes);
+}
+
+bool SilenceLimit::over() const {
+    return m_state.Careful && (m_silentFiles >= mostSilentFiles || m_tooSlow);
+}
+
+} // namespace lumora
