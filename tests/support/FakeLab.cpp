@@ -169,7 +169,7 @@ Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const
     if (onConnect)
         onConnect(connects);
     if (strikes(deadConnects))
-        return cut();
+        return Failure{deadConnectKind, u"nobody answers"_s};
     if (strikes(refusedLogins))
         return refused(u"530 Login incorrect."_s);
     return std::unique_ptr<FtpConnection>(std::make_unique<FakeConnection>(*this));

@@ -22,8 +22,9 @@ public:
     static constexpr int always = -1;
 
     // How often from now on; always is for good.
-    int deadOpens = 0;                 // the machine has no way out
-    int deadConnects = 0;              // nobody answers
+    int deadOpens = 0;    // the machine has no way out
+    int deadConnects = 0; // nobody answers
+    Failure::Kind deadConnectKind = Failure::Kind::Disconnected;
     int refusedLogins = 0;             // wrong user or password
     int failedListings = 0;            // the line is cut while a listing comes
     bool refusesEmptyListings = false; // with 550

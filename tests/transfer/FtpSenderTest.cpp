@@ -47,10 +47,11 @@ struct Line {
 
     FakeLab lab;
     TestPlatform test{lab};
-    ClientProfile profile;
-    TransferState transfer;
+    SessionState state;
+    ClientProfile& profile = state.profile;
+    TransferState& transfer = state.transfer;
     RecordedSending told;
-    FtpSender sender{profile, transfer, test.platform, told};
+    FtpSender sender{state, test.platform, told};
 };
 
 struct FtpSenderTest : ::testing::Test, Line {

@@ -28,7 +28,8 @@ FtpFrm::FtpFrm(SessionState& state, const Platform& platform, PageChain& chain)
     , File1(platform.files, filesToSend)
     , Timer1(countdownTick, [this] { countSecond(); })
     , Timer2(blinkTick, [this] { blink(); })
-    , m_sender(state.profile, state.transfer, platform, *this) {}
+    , Timer4Line(countdownTick, [this] { watchLine(); })
+    , m_sender(state, platform, *this) {}
 
 void FtpFrm::load() {
     chkPassive.checked = true;
@@ -38,6 +39,7 @@ void FtpFrm::load() {
     FtpEnableControls(false);
     showSeconds();
     Timer2.start();
+    Timer4Line.start();
 }
 
 void FtpFrm::begin() {
@@ -197,6 +199,7 @@ void FtpFrm::succeed() {
 }
 
 void FtpFrm::finish(SendingPhase end) {
+    keepArrival(end);
     if (end == SendingPhase::Success)
         succeed();
     pageSize = PageSize::Full;
@@ -214,6 +217,7 @@ void FtpFrm::finish(SendingPhase end) {
 void FtpFrm::leave() {
     m_sender.leave();
     stopTimers();
+    Timer4Line.stop();
     // During a pass the session may be inside a call; the pass closes it at its next step.
     if (!isUnderWay(phase()))
         m_sender.session.closeSession();

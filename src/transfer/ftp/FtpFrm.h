@@ -24,6 +24,7 @@ public:
     // Events.
     void Timer1_Tick() { countSecond(); }
     void Timer2_Tick() { blink(); }
+    void Timer4Line_Tick() { watchLine(); }
     void Command12_Click() { sendOrder(); }
     void Command10_Click() { sendAgain(); }
     void Image5_Click() { sendNow(); }
@@ -112,10 +113,11 @@ private:
     void FtpEnableControls(bool enable);
 
     // FtpFrmGuards.cpp
-    bool mayBeSent();    // what List3 names makes an order
-    void prepareAgain(); // the order's number is another order's on the server
-    void tellLab();      // report and done call
-    void watchLine();    // each second of a sending
+    bool mayBeSent();                   // what List3 names makes an order
+    void prepareAgain();                // the order's number is another order's on the server
+    void keepArrival(SendingPhase end); // in the order's state
+    void tellLab();                     // report and done call
+    void watchLine();                   // each second of a sending
 
     // FtpFrmTexts.cpp
     std::span<const PhaseLook> looks() const override;
@@ -167,8 +169,9 @@ private:
     QString chosenRemoteName();
 
     FileList File1;
-    Ticker Timer1; // 1000 ms: the countdown
-    Ticker Timer2; // 500 ms: the blinking
+    Ticker Timer1;     // 1000 ms: the countdown
+    Ticker Timer2;     // 500 ms: the blinking
+    Ticker Timer4Line; // 1000 ms: the watch over the line
     FtpSender m_sender;
     QStringList m_handedOver; // paths from the page of finished orders
     int m_fileCount = 0;      // files found in the folder

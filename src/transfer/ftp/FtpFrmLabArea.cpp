@@ -21,7 +21,12 @@ void FtpFrm::refillAndSendInRounds() {
     m_sender.lists.List3.clear();
     m_sender.lists.List3.append(BulkFiles(m_handedOver, inPieces()));
     addProofPicture();
-    m_sender.NumToSend = m_sender.countList3();
+    if (!mayBeSent()) {
+        if (!m_sender.stop.left)
+            enter(SendingPhase::NoOrder);
+        return;
+    }
+    m_sender.beginOrder();
     showSecondsAfterFailure();
     sendInRounds();
 }
@@ -69,11 +74,13 @@ void FtpFrm::SendChainOrder(const QString& name) {
         m_state.transfer.OrderFolder = folder;
         listFolder();
         countPictures();
-        m_sender.beginOrder();
-        m_state.transfer.ShemTikiya = name;
-        m_sender.check.ListServerFiles();
-        m_sender.check.DropAlreadySent();
-        end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
+        if (mayBeSent()) {
+            m_sender.beginOrder();
+            m_state.transfer.ShemTikiya = name;
+            m_sender.check.ListServerFiles();
+            m_sender.check.DropAlreadySent();
+            end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
+        }
         if (end == SendingPhase::NotAll)
             showFailure();
     }

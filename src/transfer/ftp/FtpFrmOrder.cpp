@@ -1,7 +1,6 @@
 // Lists the files that the page sends, for a new order or for a resend.
 #include "common/DrivePath.h"
 #include "editing/editor/gdisave.h"
-#include "order/BrokenFiles.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
 #include "order/PrintCode.h"
@@ -81,8 +80,9 @@ void FtpFrm::ShowOrderSummary() {
 void FtpFrm::armCountdown() {
     m_platform.pump.pump();
     countPictures();
-    if (lists().List3.isEmpty()) {
-        enter(SendingPhase::NoOrder);
+    if (lists().List3.isEmpty() || !mayBeSent()) {
+        if (!m_sender.stop.left)
+            enter(SendingPhase::NoOrder);
         return;
     }
     m_sender.beginOrder();
@@ -120,10 +120,6 @@ void FtpFrm::beginResend() {
     ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
     addProofPicture();
-    for (const QString& path : ReadBrokenFiles(m_platform.files, order)) {
-        if (lists.List3.contains(path))
-            lists.List4Broken.append(path);
-    }
     armCountdown();
 }
 

@@ -1,6 +1,7 @@
 #include "transfer/ftp/FtpSender.h"
 
 #include "common/FixedText.h"
+#include "order/BrokenFiles.h"
 #include "platform/Platform.h"
 #include "transfer/delivery/StoppableLine.h"
 
@@ -15,7 +16,7 @@ public:
 private:
     std::optional<SendingPhase> sendMissing(int) override {
         m_sender.pass.run();
-        return m_sender.pass.UserStopped == 0 ? std::nullopt : std::optional(SendingPhase::Stopped);
+        return m_sender.pass.UserStopped == 0 ? m_sender.pass.end() : SendingPhase::Stopped;
     }
 
     std::optional<SendingPhase> checkArrival(int attempt) override {
@@ -75,11 +76,14 @@ private:
 
     std::optional<SendingPhase> sendMissing(int) override {
         m_stop.StopFlag = false;
+        m_sender.pass.beginFiles();
         for (int i = 0; i < m_sender.lists.List3.count() && m_sender.session.ConnectFails <= mostConnectFails; ++i) {
             if (m_stop.StopFlag || m_stop.left)
                 break;
             m_sender.pass.UploadOneFile(i);
         }
+        if (m_sender.pass.endEarly())
+            return m_sender.pass.end();
         return stopped() ? std::optional(SendingPhase::Stopped) : std::nullopt;
     }
 
@@ -109,11 +113,10 @@ private:
     bool m_anyFailed = false;
 };
 
-FtpSender::FtpSender(const ClientProfile& profile, TransferState& transfer, const Platform& platform,
-                     SendingEvents& events)
-    : session(profile, transfer, platform, events, stop, lists)
-    , pass(platform, events, stop, lists, session)
-    , check(transfer, platform.pump, events, stop, lists, session)
+FtpSender::FtpSender(SessionState& state, const Platform& platform, SendingEvents& events)
+    : session(state.profile, state.transfer, platform, events, stop, lists)
+    , pass(state, platform, events, stop, lists, session)
+    , check(state.transfer, platform.pump, events, stop, lists, session)
     , m_platform(platform)
     , m_events(events) {}
 
@@ -139,6 +142,15 @@ void FtpSender::beginOrder() {
     session.beginOrder();
     lists.List4Makor.clear();
     lists.List4Makor.append(lists.List3.items());
+    takeBroken();
+}
+
+void FtpSender::takeBroken() {
+    const OrderJournal& journal = *session.journal();
+    for (const QString& path : ReadBrokenFiles(m_platform.files, journal.folder()) + journal.state().filesInHand) {
+        if (lists.List3.contains(path) && !lists.List4Broken.contains(path))
+            lists.List4Broken.append(path);
+    }
 }
 
 std::int16_t FtpSender::countList3() const {

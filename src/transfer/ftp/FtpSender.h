@@ -11,11 +11,12 @@ public:
     static constexpr int attempts = 4;
     static constexpr int olderRounds = 3;
 
-    FtpSender(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events);
+    FtpSender(SessionState& state, const Platform& platform, SendingEvents& events);
 
     // Removes all that belongs to an earlier order.
     void clearLists();
-    // Takes List3 as the whole order.
+    // Takes List3 as the whole order of OrderFolder, and as broken what an earlier sending left so of it: the files of
+    // kashloo.txt and those that were in hand when a program ended.
     void beginOrder();
     std::int16_t countList3() const;
     // Puts the whole order into List3 again; the pass skips what has arrived.
@@ -44,6 +45,8 @@ public:
     std::int16_t NumToSend = 0; // number of files that make up the order
 
 private:
+    void takeBroken();
+
     class FourAttempts;
     class OlderRounds;
 

@@ -45,6 +45,11 @@ FtpSession::FtpSession(const ClientProfile& profile, TransferState& transfer, co
     , m_stop(stop)
     , m_lists(lists) {}
 
+void FtpSession::beginOrder() {
+    m_putBegun = false;
+    m_journal.emplace(m_platform.files, OrderFolder(m_transfer.OrderFolder));
+}
+
 void FtpSession::beginPass() {
     ConnectFails = 0;
     RoundNo = 0;
@@ -103,10 +108,12 @@ void FtpSession::FtpOpenInternet() {
 
 void FtpSession::FtpConnectServer() {
     m_lists.List1.clear();
+    connectTimedOut = false;
     if (!bActiveSession && hOpen) {
         const auto channel = passive ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
         int count = 0;
         Failure last = noLine();
+        connectTimedOut = true;
         while (count < connectAttempts && !hConnection && !m_stop.left && !m_stop.StopFlag) {
             pump();
             if (m_stop.StopFlag)
@@ -117,6 +124,7 @@ void FtpSession::FtpConnectServer() {
                 hConnection = std::move(*connected);
             else
                 last = connected.failure();
+            connectTimedOut = connectTimedOut && !connected && last.kind == Failure::Kind::TimedOut;
         }
         if (!hConnection) {
             bActiveSession = false;
@@ -223,6 +231,7 @@ bool FtpSession::EnterOrderFolder() {
     if (m_lists.List5.contains(name)) {
         if (!enterListedFolder(name))
             return false;
+        keep(m_journal->sendingBegins(Sender::Ftp, false));
         tell(SendingMoment::Continuing);
         pump();
         tell(SendingMoment::Ready);
@@ -230,7 +239,9 @@ bool FtpSession::EnterOrderFolder() {
     }
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
-    FtpMakeOrderDir(name);
+    const bool made = FtpMakeOrderDir(name);
+    if (made)
+        keep(m_journal->sendingBegins(Sender::Ftp, true));
     pump();
     if (!bActiveSession || !hConnection) {
         log(u"after MakeRemoteDir"_s);
@@ -242,21 +253,24 @@ bool FtpSession::EnterOrderFolder() {
         return false;
     }
     m_inOrderFolder = true;
+    if (!made)
+        keep(m_journal->sendingBegins(Sender::Ftp, false));
     FillListFromNames(Target::List2, name);
     tell(SendingMoment::Ready);
     return true;
 }
 
-void FtpSession::FtpMakeOrderDir(const QString& name) {
+bool FtpSession::FtpMakeOrderDir(const QString& name) {
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
         trouble(LineStep::OrderFolder, made.failure());
         log(u" make remotedir fail"_s);
-        return;
+        return false;
     }
     m_lists.List2.clear();
     ListRemoteChecked();
     FillListFromNames(Target::List2, name);
+    return true;
 }
 
 bool FtpSession::FtpSendFile(const QString& path) {
@@ -272,8 +286,13 @@ bool FtpSession::FtpSendFile(const QString& path) {
     const DrivePath file(path);
     const auto local = files.drives().toHost(file);
     m_putBegun = true;
-    const auto sent = local && files.fileExists(file) ? hConnection->put(*local, name)
-                                                      : Result<void>(Failure{Failure::Kind::NotFound, path});
+    Result<void> sent = Failure{Failure::Kind::NotFound, path};
+    if (local && files.fileExists(file)) {
+        keep(m_journal->take(path));
+        sent = hConnection->put(*local, name);
+        if (sent)
+            keep(m_journal->release(path));
+    }
     pump();
     if (sent)
         return true;
@@ -286,7 +305,12 @@ bool FtpSession::FtpSendFile(const QString& path) {
 }
 
 void FtpSession::keepBrokenFiles() {
-    const auto written = WriteBrokenFiles(m_platform.files, OrderFolder(m_transfer.OrderFolder), m_lists.List4Broken);
+    const OrderFolder order(m_transfer.OrderFolder);
+    if (!m_lists.List4Broken.isEmpty() || m_platform.files.fileExists(order.brokenFilesPath()))
+        keep(WriteBrokenFiles(m_platform.files, order, m_lists.List4Broken));
+}
+
+void FtpSession::keep(const Result<void>& written) {
     if (!written && !std::exchange(m_notKeptTold, true))
         m_events.brokenNotKept(written.failure());
 }

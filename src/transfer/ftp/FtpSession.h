@@ -1,6 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
+#include "order/OrderJournal.h"
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/Attempts.h"
@@ -9,6 +10,7 @@
 #include <QStringList>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
 namespace lumora {
@@ -24,8 +26,12 @@ public:
     FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events,
                SendingStop& stop, FtpLists& lists);
 
-    // An order begins: nothing of it has been put.
-    void beginOrder() { m_putBegun = false; }
+    // The order of OrderFolder begins: nothing of it has been put. Reads its state.
+    void beginOrder();
+    // The state of that order. Before beginOrder there is none.
+    OrderJournal* journal() { return m_journal ? &*m_journal : nullptr; }
+    // A step that could not be kept on this machine is told once a pass.
+    void keep(const Result<void>& written);
     // Begins a pass: resets its counters, and failures that are told once a pass may be told again.
     void beginPass();
 
@@ -46,9 +52,10 @@ public:
     // Enters an order's folder that List5 names and reads its names into List6. False on failure, with List6 unchanged.
     bool enterListedFolder(const QString& name);
     bool inOrderFolder() const { return m_inOrderFolder; }
-    void FtpMakeOrderDir(const QString& name);
+    bool FtpMakeOrderDir(const QString& name);
 
-    // Puts one file. A failed put is added to LogList, List7 and List4Broken. False without a session, too.
+    // Puts one file, whose name stands in the order's state until the put is confirmed. A failed put is added to
+    // LogList, List7 and List4Broken. False without a session, too.
     bool FtpSendFile(const QString& path);
     // Writes List4Broken to kashloo.txt. A failed write is told once a pass.
     void keepBrokenFiles();
@@ -93,9 +100,10 @@ public:
     std::int16_t ConnectFails = 0;
     std::int16_t RoundNo = 0;
     QString FtpHost, FtpUser, FtpPass;
-    QString MikumBaSharat;   // current remote directory without its leading slash
-    QString RemoteDirectory; // last directory asked for
-    QString LastResponse;    // the server's reply to the last refused command
+    QString MikumBaSharat;        // current remote directory without its leading slash
+    QString RemoteDirectory;      // last directory asked for
+    QString LastResponse;         // the server's reply to the last refused command
+    bool connectTimedOut = false; // the last connect: every try ran into the time limit
 
 private:
     void tell(SendingMoment moment, int number = 0) { m_events.reached(moment, number); }
@@ -117,6 +125,7 @@ private:
     SendingEvents& m_events;
     SendingStop& m_stop;
     FtpLists& m_lists;
+    std::optional<OrderJournal> m_journal;
     bool m_inOrderFolder = false;
     bool m_putBegun = false; // a put of this order has been tried, so its folder may hold something
     QString m_unreadLine;

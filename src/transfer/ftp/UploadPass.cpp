@@ -4,14 +4,19 @@
 #include "order/BrokenFiles.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
 #include "transfer/delivery/UploadProgress.h"
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 void UploadPass::run() {
     m_events.reached(SendingMoment::PassBegins);
     m_session.beginPass();
     m_stop.StopFlag = false;
+    beginFiles();
     // The time since the last piece of an earlier pass tells nothing about the pace.
     LastPartTime = {};
     for (int i = 0; i < m_lists.List3.count() && !m_stop.StopFlag && !m_stop.left; ++i) {
@@ -21,10 +26,45 @@ void UploadPass::run() {
     }
     if (m_stop.left)
         return;
+    if (endEarly())
+        return;
     if (m_stop.StopFlag)
         endStopped();
     else
         m_events.reached(SendingMoment::PassEnds);
+}
+
+void UploadPass::beginFiles() {
+    m_end.reset();
+    m_silence.begin();
+    m_skipped = 0;
+    m_running = true;
+}
+
+bool UploadPass::endEarly() {
+    m_running = false;
+    if (!m_end || m_stop.left)
+        return false;
+    m_session.closeSession();
+    m_stop.StopFlag = false;
+    m_events.failed(LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
+    return true;
+}
+
+void UploadPass::watch() {
+    if (!m_running || m_end)
+        return;
+    m_silence.moved(m_platform.internet.bytesMoved() + m_skipped, m_platform.clock.now());
+    if (!m_silence.over())
+        return;
+    endSilent();
+    m_platform.internet.abort();
+}
+
+// By the way of a stop, which ends whatever is under way.
+void UploadPass::endSilent() {
+    m_end = SendingPhase::NotAll;
+    m_stop.StopFlag = true;
 }
 
 void UploadPass::endStopped() {
@@ -60,6 +100,9 @@ void UploadPass::UploadOneFile(int index) {
     m_events.reached(SendingMoment::Reaching);
     m_session.PauseBar(2);
     m_session.walkToLabFolder();
+    m_silence.connectsTimedOut(m_session.connectTimedOut);
+    if (m_silence.over() && !m_stop.StopFlag)
+        endSilent();
     if (!m_session.FolderOk) {
         closeWithPauses();
         m_events.reached(SendingMoment::Unreached);
@@ -86,6 +129,8 @@ void UploadPass::send(const QString& path) {
     const bool onServer = m_lists.List6.contains(name);
     const bool remains = onServer && IsBroken(m_lists.List4Broken, name);
     if (onServer && !remains) {
+        if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
+            m_skipped += *length;
         m_events.reached(SendingMoment::Skipped);
     } else {
         // The server may still hold open the file of a broken connection; it accepts the name again after the remains

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "transfer/delivery/SilenceLimit.h"
 #include "transfer/ftp/FtpSession.h"
 
 #include <QDateTime>
@@ -9,14 +10,24 @@ namespace lumora {
 // One pass over List3: each file in a session of its own; files that the server has are skipped.
 class UploadPass {
 public:
-    UploadPass(const Platform& platform, SendingEvents& events, SendingStop& stop, FtpLists& lists, FtpSession& session)
+    UploadPass(const SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
+               FtpLists& lists, FtpSession& session)
         : m_platform(platform)
         , m_events(events)
         , m_stop(stop)
         , m_lists(lists)
-        , m_session(session) {}
+        , m_session(session)
+        , m_silence(state) {}
 
     void run();
+    // An end of the sending that the last pass has reached by itself, and that another attempt would not mend.
+    std::optional<SendingPhase> end() const { return m_end; }
+    // Each second: ends a pass whose line is silent.
+    void watch();
+
+    // The two ends of a pass whose files the caller walks. endEarly: false where the pass has no end of its own.
+    void beginFiles();
+    bool endEarly();
     // index: of List3.
     void UploadOneFile(int index);
     // Ends a stopped pass: closes the session and tells the stop.
@@ -29,6 +40,7 @@ public:
     bool FaultPressed = false; // no page reads it
 
 private:
+    void endSilent();
     void tellPiece(int index);
     void send(const QString& path);
     void put(const QString& path, const QString& name);
@@ -39,6 +51,10 @@ private:
     SendingStop& m_stop;
     FtpLists& m_lists;
     FtpSession& m_session;
+    SilenceLimit m_silence;
+    std::optional<SendingPhase> m_end;
+    bool m_running = false;
+    qint64 m_skipped = 0; // bytes of the files that the server has, of this pass
 };
 
 } // namespace lumora

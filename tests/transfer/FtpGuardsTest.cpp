@@ -1,0 +1,200 @@
+#include "order/OrderFolder.h"
+#include "order/OrderLog.h"
+#include "order/OrderState.h"
+#include "support/FakeLab.h"
+#include "support/FtpFrmRig.h"
+#include "transfer/delivery/SilenceLimit.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+
+namespace lumora {
+
+namespace {
+
+// The sending page with the guards on or off, over a lab that has the folder of the orders. The order's log names its
+// two pictures.
+struct Guarded {
+    explicit Guarded(bool careful) {
+        lab.folders[u"zalamim234"_s];
+        rig.state.Careful = careful;
+        rig.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+        log({});
+    }
+
+    void log(const QStringList& failed) {
+        const QStringList items = {u"021015GNBC:\\pics\\aabb.jpg"_s, u"111015GNBC:\\pics\\aacc.jpg"_s};
+        rig.write(FtpFrmRig::log(),
+                  OrderLog::of(rig.state, OrderLog::Layout::Plain, items, failed, rig.test.clock.time).write());
+    }
+    void remove(const QString& leaf) { EXPECT_TRUE(rig.test.files.removeFile(FtpFrmRig::local(leaf))); }
+    OrderState kept() const {
+        const Result<OrderState> state = ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()));
+        return state ? *state : OrderState();
+    }
+    FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
+
+    FakeLab lab;
+    FtpFrmRig rig{lab};
+};
+
+} // namespace
+
+TEST(FtpGuards, AnOrderWithoutPicturesDoesNotLeave) {
+    struct Case {
+        const char* what;
+        std::function<void(Guarded&)> arrange;
+        QList<bool> answers;
+        SendingPhase phase;
+        int messages;
+        int questions;
+    };
+    const auto noPrints = [](Guarded& order) {
+        order.remove(FtpFrmRig::first());
+        order.remove(FtpFrmRig::second());
+    };
+    const auto onePrint = [](Guarded& order) { order.remove(FtpFrmRig::second()); };
+    const Case cases[] = {
+        {"whole", [](Guarded&) {}, {}, SendingPhase::Countdown, 0, 0},
+        {"the whole choice cancelled",
+         [](Guarded& order) {
+             order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::sheet()});
+         },
+         {},
+         SendingPhase::NoOrder,
+         1,
+         0},
+        {"prints cleaned away", noPrints, {}, SendingPhase::NoOrder, 1, 0},
+        {"each picture failed",
+         [&](Guarded& order) {
+             noPrints(order);
+             order.log({u"C:\\pics\\aabb.jpg"_s, u"C:\\pics\\aacc.jpg"_s});
+         },
+         {},
+         SendingPhase::NoOrder,
+         1,
+         0},
+        {"one picture failed",
+         [&](Guarded& order) {
+             onePrint(order);
+             order.log({u"C:\\pics\\aacc.jpg"_s});
+         },
+         {},
+         SendingPhase::Countdown,
+         0,
+         0},
+        {"a picture is gone, no", onePrint, {false}, SendingPhase::NoOrder, 0, 1},
+        {"a picture is gone, yes", onePrint, {true}, SendingPhase::Countdown, 0, 1},
+        {"no log tells", [](Guarded& order) { order.remove(FtpFrmRig::log()); }, {}, SendingPhase::Countdown, 0, 0},
+    };
+    for (const Case& each : cases) {
+        for (const bool careful : {true, false}) {
+            SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : ""));
+            Guarded order(careful);
+            each.arrange(order);
+            order.rig.test.dialogs.answers = each.answers;
+            EXPECT_EQ(order.rig.start().phase(), careful ? each.phase : SendingPhase::Countdown);
+            EXPECT_EQ(order.rig.test.dialogs.messages.size(), careful ? each.messages : 0);
+            ASSERT_EQ(order.rig.test.dialogs.questions.size(), careful ? each.questions : 0);
+            if (careful && each.questions > 0) {
+                EXPECT_TRUE(order.rig.test.dialogs.questions[0].contains(u"2 תמונות, ורק 1"_s));
+            }
+        }
+    }
+}
+
+TEST(FtpGuards, ALimitOfSilenceCountsFilesAndBytes) {
+    SessionState state;
+    state.Careful = true;
+    const QDateTime start(QDate(2026, 11, 21), QTime(14, 0));
+    struct Step {
+        int second;
+        qint64 bytes;
+    };
+    struct Case {
+        const char* what;
+        std::vector<Step> steps; // each 20 seconds between two of them is told too, with the bytes of the one before
+        bool over;
+    };
+    const Case cases[] = {
+        {"nothing for five minutes", {{0, 0}, {299, 0}}, false},
+        {"and a second more", {{0, 0}, {300, 0}}, true},
+        {"slow", {{0, 0}, {300, 299'999}}, true},
+        {"just fast enough", {{0, 0}, {300, 300'000}}, false},
+        {"fast, then still", {{0, 0}, {100, 9'000'000}, {399, 9'000'000}}, false},
+        {"fast, then still for long", {{0, 0}, {100, 9'000'000}, {420, 9'000'000}}, true},
+        {"the clock is set on", {{0, 0}, {7200, 0}}, false},
+        {"the clock is set back", {{200, 0}, {0, 0}, {200, 0}}, false},
+    };
+    for (const Case& each : cases) {
+        SilenceLimit limit(state);
+        limit.begin();
+        int second = each.steps.front().second;
+        qint64 bytes = 0;
+        for (const Step& step : each.steps) {
+            for (; step.second - second < 3600 && second < step.second; second += 20)
+                limit.moved(bytes, start.addSecs(second));
+            second = step.second;
+            bytes = step.bytes;
+            limit.moved(bytes, start.addSecs(second));
+        }
+        EXPECT_EQ(limit.over(), each.over) << each.what;
+        limit.begin();
+        EXPECT_FALSE(limit.over()) << each.what;
+    }
+    SilenceLimit limit(state);
+    for (const bool timedOut : {true, false, true})
+        limit.connectsTimedOut(timedOut);
+    EXPECT_FALSE(limit.over());
+    limit.connectsTimedOut(true);
+    EXPECT_TRUE(limit.over());
+    state.Careful = false;
+    EXPECT_FALSE(limit.over());
+}
+
+TEST(FtpGuards, TwoFilesWithoutAnAnswerEndTheSending) {
+    for (const bool careful : {true, false}) {
+        Guarded order(careful);
+        order.lab.deadConnects = FakeLab::always;
+        order.lab.deadConnectKind = Failure::Kind::TimedOut;
+        order.rig.send();
+        EXPECT_EQ(order.rig.page().phase(), SendingPhase::NotAll);
+        EXPECT_EQ(order.rig.page().controls().Label2.text.contains(u"איטי מדי"_s), careful);
+        EXPECT_EQ(order.rig.page().controls().Label34.text.isEmpty(), careful) << "the first attempt alone";
+        if (careful) {
+            EXPECT_EQ(order.lab.connects, 2 * 5);
+        } else {
+            EXPECT_GT(order.lab.connects, 4 * 5 * 5);
+        }
+        EXPECT_TRUE(order.rig.test.dialogs.messages.isEmpty()) << "the customer has not stopped it";
+        order.lab.deadConnects = 0;
+        order.rig.page().Command10_Click();
+        EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
+    }
+}
+
+TEST(FtpGuards, APassThatStandsStillEndsAndItsFileIsBroken) {
+    for (const bool careful : {true, false}) {
+        Guarded order(careful);
+        order.lab.onPut = [&](const QString& name) {
+            for (int i = 0; name == FtpFrmRig::first() && i < 31; ++i) {
+                order.rig.test.clock.time = order.rig.test.clock.time.addSecs(10);
+                order.rig.page().Timer4Line_Tick();
+            }
+        };
+        order.rig.send();
+        EXPECT_EQ(order.rig.page().phase(), careful ? SendingPhase::NotAll : SendingPhase::Success);
+        EXPECT_EQ(order.lab.aborts, careful ? 1 : 0);
+        if (!careful)
+            continue;
+        EXPECT_EQ(order.lab.puts.last(), FtpFrmRig::first());
+        EXPECT_EQ(order.kept().filesInHand, QStringList(FtpFrmRig::local(FtpFrmRig::first()).text()));
+        order.lab.onPut = {};
+        order.rig.page().Command10_Click();
+        EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
+        EXPECT_EQ(order.remote()[FtpFrmRig::first()], order.rig.localFiles()[FtpFrmRig::first()]);
+    }
+}
+
+} // namespace lumora
