@@ -166,6 +166,9 @@ Result<void> Workspace::writeCounter() const {
     if (const Result<void> made = MakeCounterFolder(); !made)
         return made;
     const long long next = counterValue(m_state.MisparHazmana) + 1;
+    const Result<QByteArray> stored = m_files.read(WorkspacePaths::counter(m_state));
+    if (stored && counterValue(firstLine(*stored).value_or(QString())) >= next)
+        return {};
     return m_files.writeWhole(WorkspacePaths::counter(m_state), QByteArray::number(next) + "\r\n");
 }
 

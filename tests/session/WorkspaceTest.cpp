@@ -55,6 +55,9 @@ TEST_F(WorkspaceTest, WritesTheNextNumberAndReadsItAtTheNextOrder) {
     EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "101\r\n");
     ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"101");
+    put(WorkspacePaths::counter(state), "108\r\n");
+    ASSERT_TRUE(workspace.writeCounter().ok());
+    EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "108\r\n") << "the counter never goes back";
 }
 
 TEST_F(WorkspaceTest, TakesWhatItCanOfADamagedCounter) {
