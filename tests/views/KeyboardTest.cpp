@@ -166,7 +166,7 @@ TEST(Language, TurnsOverOnEachPageAndBack) {
                 << qPrintable(pageName(id));
             // A slow machine lays the page out over several turns.
             QStringList faults = walk.faults();
-            for (int turn = 0; turn < 50 && !faults.isEmpty(); ++turn) {
+            for (int turn = 0; turn < 500 && !faults.isEmpty(); ++turn) {
                 walk.settle(60);
                 faults = walk.faults();
             }

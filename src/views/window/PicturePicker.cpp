@@ -30,7 +30,7 @@ public:
         , m_theme(theme) {}
 
     QSize sizeHint(const QStyleOptionViewItem&, const QModelIndex&) const override {
-        return {m_theme.px(166), m_theme.px(172)};
+        return {m_theme.px(160), m_theme.px(172)};
     }
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
