@@ -12,94 +12,55 @@
 namespace lumora {
 namespace {
 
-using Names = ArrivalProof::Names;
+// "a.jpp=9 b": names with a length in bytes, or without one.
+QList<RemoteFile> filesOf(const char* text) {
+    QList<RemoteFile> files;
+    for (const QString& file : QString::fromLatin1(text).split(u' ', Qt::SkipEmptyParts)) {
+        const auto equals = file.indexOf(u'=');
+        files += equals < 0 ? RemoteFile{file, {}} : RemoteFile{file.left(equals), file.mid(equals + 1).toLongLong()};
+    }
+    return files;
+}
 
 TEST(AnArrival, isProvenByEachNameAndEachLength) {
-    struct Case {
+    constexpr auto exact = ArrivalProof::Names::Exact;
+    constexpr auto anyCase = ArrivalProof::Names::WithoutCase;
+    const char* const two = "a.txt=10 B.jpp=900";
+    const struct {
         const char* what;
-        QList<LocalFile> here;
-        QList<RemoteFile> there;
-        Names names;
+        const char* here;
+        const char* there;
+        ArrivalProof::Names names;
         const char* found; // missing | broken | by length | by name | common
-        bool proven;
-        bool byNameOnly;
+    } cases[] = {
+        {"whole", two, "B.jpp=900 a.txt=10", exact, "||a.txt,B.jpp||"},
+        {"another customer's names beside", two, "a.txt=10 x=1 B.jpp=900 ..", exact, "||a.txt,B.jpp||"},
+        {"count equal, a name missing", two, "a.txt=10 b.jpp=900", exact, "B.jpp||a.txt||"},
+        {"letter case of a web server", two, "A.TXT=10 b.jpp", anyCase, "||a.txt|B.jpp|"},
+        {"a part of a name", two, "a . B.jpp.part=900", anyCase, "a.txt,B.jpp||||"},
+        {"cut short and emptied", two, "a.txt=0 B.jpp=899", exact, "|a.txt,B.jpp|||"},
+        {"longer", two, "a.txt=11 B.jpp=900", exact, "|a.txt|B.jpp||"},
+        {"no length told", two, "a.txt B.jpp", exact, "|||a.txt,B.jpp|"},
+        {"the proof picture of another order", "000.jpg=5", "000.jpg=7", exact, "||||000.jpg"},
+        {"no proof picture", "000.jpg=5", "", exact, "000.jpg||||"},
+        {"both letter cases there, ours is cut", "a.jpp=9", "A.jpp=9 a.jpp=4", anyCase, "|a.jpp|||"},
+        {"a name told twice, once with its length", "a.jpp=9", "a.jpp a.jpp=8", exact, "|a.jpp|||"},
+        {"a file of the order twice", "a=1 a=1", "a=1", exact, "||a||"},
+        {"an empty file and an empty server", "a=0", "", exact, "a||||"},
+        {"an empty file that arrived", "a=0", "a=0", exact, "||a||"},
     };
-    const std::optional<qint64> none;
-    const QList<LocalFile> two = {{u"a.txt"_s, 10}, {u"B.jpp"_s, 900}};
-    const Case cases[] = {
-        {"whole", two, {{u"B.jpp"_s, 900}, {u"a.txt"_s, 10}}, Names::Exact, "||a.txt,B.jpp||", true, false},
-        {"another customer's names beside",
-         two,
-         {{u"a.txt"_s, 10}, {u"x"_s, 1}, {u"B.jpp"_s, 900}, {u".."_s, none}},
-         Names::Exact,
-         "||a.txt,B.jpp||",
-         true,
-         false},
-        {"count equal, a name missing",
-         two,
-         {{u"a.txt"_s, 10}, {u"b.jpp"_s, 900}},
-         Names::Exact,
-         "B.jpp||a.txt||",
-         false,
-         false},
-        {"letter case of a web server",
-         two,
-         {{u"A.TXT"_s, 10}, {u"b.jpp"_s, none}},
-         Names::WithoutCase,
-         "||a.txt|B.jpp|",
-         true,
-         true},
-        {"a part of a name",
-         two,
-         {{u"a"_s, none}, {u"."_s, none}, {u"B.jpp.part"_s, 900}},
-         Names::WithoutCase,
-         "a.txt,B.jpp||||",
-         false,
-         false},
-        {"cut short and emptied",
-         two,
-         {{u"a.txt"_s, 0}, {u"B.jpp"_s, 899}},
-         Names::Exact,
-         "|a.txt,B.jpp|||",
-         false,
-         false},
-        {"longer", two, {{u"a.txt"_s, 11}, {u"B.jpp"_s, 900}}, Names::Exact, "|a.txt|B.jpp||", false, false},
-        {"no length told", two, {{u"a.txt"_s, none}, {u"B.jpp"_s, none}}, Names::Exact, "|||a.txt,B.jpp|", true, true},
-        {"the proof picture of another order",
-         {{u"000.jpg"_s, 5}},
-         {{u"000.jpg"_s, 7}},
-         Names::Exact,
-         "||||000.jpg",
-         true,
-         false},
-        {"no proof picture", {{u"000.jpg"_s, 5}}, {}, Names::Exact, "000.jpg||||", false, false},
-        {"both letter cases there, ours is cut",
-         {{u"a.jpp"_s, 9}},
-         {{u"A.jpp"_s, 9}, {u"a.jpp"_s, 4}},
-         Names::WithoutCase,
-         "|a.jpp|||",
-         false,
-         false},
-        {"a name told twice, once with its length",
-         {{u"a.jpp"_s, 9}},
-         {{u"a.jpp"_s, none}, {u"a.jpp"_s, 8}},
-         Names::Exact,
-         "|a.jpp|||",
-         false,
-         false},
-        {"a file of the order twice", {{u"a"_s, 1}, {u"a"_s, 1}}, {{u"a"_s, 1}}, Names::Exact, "||a||", true, false},
-        {"an empty file and an empty server", {{u"a"_s, 0}}, {}, Names::Exact, "a||||", false, false},
-        {"an empty file that arrived", {{u"a"_s, 0}}, {{u"a"_s, 0}}, Names::Exact, "||a||", true, false},
-    };
-    for (const Case& c : cases) {
+    for (const auto& c : cases) {
         SCOPED_TRACE(c.what);
-        const ArrivalProof proof = ArrivalProof::of(c.here, c.there, c.names);
+        QList<LocalFile> here;
+        for (const RemoteFile& file : filesOf(c.here))
+            here += {file.name, *file.length};
+        const ArrivalProof proof = ArrivalProof::of(here, filesOf(c.there), c.names);
         QStringList found;
         for (const QStringList& list : {proof.missing, proof.broken, proof.byLength, proof.byName, proof.commonName})
             found += list.join(u',');
         EXPECT_EQ(found.join(u'|').toStdString(), c.found);
-        EXPECT_EQ(proof.proven(), c.proven);
-        EXPECT_EQ(proof.provenByNameOnly(), c.byNameOnly);
+        EXPECT_EQ(proof.proven(), found[0].isEmpty() && found[1].isEmpty());
+        EXPECT_EQ(proof.provenByNameOnly(), proof.proven() && !found[3].isEmpty());
     }
 }
 
@@ -161,6 +122,7 @@ TEST(AnOrder, isWholeWhenEveryPrintOfItsLogIsThereAndMarked) {
     using Layout = OrderLog::Layout;
     const QStringList three = {printName(0), printName(1), printName(2)};
     const QStringList besides = {u"!105_1234.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s, u"000.jpg"_s, u"kashloo.txt"_s};
+    const QStringList pieces = three.mid(0, 2) << piece(2, "001_003") << piece(2, "002_003") << piece(2, "003_003");
     struct Case {
         const char* what;
         int failed;
@@ -177,16 +139,8 @@ TEST(AnOrder, isWholeWhenEveryPrintOfItsLogIsThereAndMarked) {
         {"the prints were cleaned away", 0, besides, three, Verdict::None},
         {"one is not marked", 0, three, three.mid(1), Verdict::Fewer},
         {"one is lost", 0, three.mid(1), three, Verdict::Fewer},
-        {"pieces in place of a print",
-         0,
-         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
-         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
-         Verdict::Whole},
-        {"a piece is not marked",
-         0,
-         {printName(0), printName(1), piece(2, "001_003"), piece(2, "002_003"), piece(2, "003_003")},
-         {printName(0), printName(1), piece(2, "001_003"), piece(2, "003_003")},
-         Verdict::Fewer},
+        {"pieces in place of a print", 0, pieces, pieces, Verdict::Whole},
+        {"a piece is not marked", 0, pieces, pieces.mid(0, 3) << pieces.last(), Verdict::Fewer},
     };
     for (const Layout layout : {Layout::Plain, Layout::Edited, Layout::Album}) {
         for (const Case& c : cases) {

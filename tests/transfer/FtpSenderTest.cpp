@@ -158,6 +158,7 @@ TEST_F(FtpSenderTest, NotesAFailedPutWithHourAndMinuteAsTheyAre) {
 
 // The faults that a relay can make on a real line stand with the real server; here those of a server's own doing.
 TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
+    using enum SendingPhase;
     const struct {
         const char* name;
         std::function<void(Line&)> arrange;
@@ -165,49 +166,48 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
         int attempts;
         qsizetype puts;
     } cases[] = {
-        {"clean", [](Line&) {}, SendingPhase::Success, 1, 3},
-        {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, SendingPhase::Success, 1, 3},
+        {"clean", [](Line&) {}, Success, 1, 3},
+        {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, Success, 1, 3},
         {"an empty folder's listing is refused",
          [](Line& line) {
              line.remote();
              line.lab.refusesEmptyListings = true;
          },
-         SendingPhase::Success, 1, 3},
-        {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, SendingPhase::NotAll,
-         4, 3},
-        {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, SendingPhase::NotAll, 4, 0},
-        {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, SendingPhase::NotAll, 4, 0},
+         Success, 1, 3},
+        {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, NotAll, 4, 3},
+        {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, NotAll, 4, 0},
+        {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
         {"cut, and the remains can't be deleted",
          [](Line& line) {
              line.lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
              line.lab.refusesDelete = true;
          },
-         SendingPhase::Success, 2, 4},
+         Success, 2, 4},
         {"cut in each attempt, remains stay",
          [](Line& line) {
              line.lab.putFaults = {{u"02b.jpp"_s, FakeLab::always, 20}};
              line.lab.refusesDelete = true;
          },
-         SendingPhase::NotAll, 4, 6},
+         NotAll, 4, 6},
         {"the folder of a local file itself",
          [](Line& line) {
              line.order({u"01a.jpp"_s, QString()});
          },
-         SendingPhase::NotAll, 4, 1},
-        {"all there, and a stranger beside it", [](Line& line) { line.remote()[u"stranger.jpp"_s] = "x"; },
-         SendingPhase::AllThere, 4, 3},
+         NotAll, 4, 1},
+        {"all there, and a stranger beside it", [](Line& line) { line.remote()[u"stranger.jpp"_s] = "x"; }, AllThere, 4,
+         3},
         {"strangers and a file that never arrives",
          [](Line& line) {
              line.remote() = {{u"x1"_s, "x"}, {u"x2"_s, "x"}};
              line.lab.putFaults = {{u"01a.jpp"_s, FakeLab::always, -1}};
          },
-         SendingPhase::Unclear, 4, 6},
+         Unclear, 4, 6},
         {"one name twice in the order",
          [](Line& line) {
              line.order({u"01a.jpp"_s, u"01a.jpp"_s, u"02b.jpp"_s});
          },
-         SendingPhase::Unclear, 1, 2},
-        {"an empty order", [](Line& line) { line.order({}); }, SendingPhase::NoOrder, 1, 0},
+         Unclear, 1, 2},
+        {"an empty order", [](Line& line) { line.order({}); }, NoOrder, 1, 0},
     };
     for (const auto& each : cases) {
         SCOPED_TRACE(each.name);
@@ -216,7 +216,7 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
         EXPECT_EQ(line.sender.RunAttempts(), each.end);
         EXPECT_EQ(line.told.number(AttemptBegins), each.attempts);
         EXPECT_EQ(line.lab.puts.size(), each.puts);
-        EXPECT_TRUE(each.end != SendingPhase::Success || line.remote().size() == 3u);
+        EXPECT_TRUE(each.end != Success || line.remote().size() == 3u);
     }
 }
 

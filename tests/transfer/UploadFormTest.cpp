@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 namespace lumora {
 namespace {
 
@@ -35,69 +37,70 @@ TEST_F(UploadFormTest, AResendIsNotReportedAndAnOrderThatIsThereIsNotSent) {
 }
 
 TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
-    const struct {
+    const auto lost = [](int times, const QStringList& names) {
+        std::map<QString, int> losses;
+        for (const QString& name : names)
+            losses[name] = times;
+        return losses;
+    };
+    const auto [log, sheet, first, second, third] =
+        std::array{UploadFormRig::log(), UploadFormRig::sheet(), UploadFormRig::first(), UploadFormRig::second(),
+                   UploadFormRig::third()};
+    struct Case {
         const char* fault;
-        std::function<void(FakeWebLab&)> set;
-        bool done;
-        int posted; // in all attempts
+        int deadPosts = 0;
+        int deadCalls = 0;
+        std::map<QString, int> losses = {};
+        bool refusesLists = false;
+        std::optional<QByteArray> list = {};
+        QStringList absent = {}; // not in this order
+        int posted = 15;         // in all attempts
         LineStep reason = LineStep::Confirm;
-    } cases[] = {
-        {"nobody answers", [](FakeWebLab& l) { l.deadPosts = l.deadCalls = FakeLab::always; }, false, 15,
-         LineStep::Put},
-        {"the line is gone each time when the list is asked for", [](FakeWebLab& l) { l.deadCalls = FakeLab::always; },
-         false, 15, LineStep::List},
-        {"every file is answered and none is stored, as by a script that fails",
-         [](FakeWebLab& l) {
-             for (const QString& name : {UploadFormRig::log(), UploadFormRig::sheet(), UploadFormRig::first(),
-                                         UploadFormRig::second(), UploadFormRig::third()})
-                 l.losses[name] = FakeLab::always;
-         },
-         false, 15},
-        {"no list is given out", [](FakeWebLab& l) { l.refusesLists = true; }, false, 15},
-        {"a list without a total",
-         [](FakeWebLab& l) { l.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"; }, false,
-         15},
-        {"a short list", [](FakeWebLab& l) { l.listInstead = "total:5"; }, false, 15},
-        {"four files lost, so that no list has their number",
-         [](FakeWebLab& l) {
-             l.losses = {{UploadFormRig::log(), 1},
-                         {UploadFormRig::first(), 1},
-                         {UploadFormRig::second(), 1},
-                         {UploadFormRig::third(), 1}};
-         },
-         false, 14},
+        bool done = false;
+    };
+    const Case cases[] = {
+        {.fault = "nobody answers",
+         .deadPosts = FakeLab::always,
+         .deadCalls = FakeLab::always,
+         .reason = LineStep::Put},
+        {.fault = "no line to the list", .deadCalls = FakeLab::always, .reason = LineStep::List},
+        {.fault = "a script that fails", .losses = lost(FakeLab::always, {log, sheet, first, second, third})},
+        {.fault = "no list is given out", .refusesLists = true},
+        {.fault = "a list without a total", .list = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"},
+        {.fault = "a short list", .list = "total:5"},
+        {.fault = "four files lost, and no list has their number",
+         .losses = lost(1, {log, first, second, third}),
+         .posted = 14},
         // The load's check takes three calls, that of an attempt three.
-        {"the server is back at the second attempt",
-         [](FakeWebLab& l) {
-             l.deadCalls = 3;
-             l.deadPosts = 2;
-         },
-         true, 7},
+        {.fault = "back at the second attempt", .deadPosts = 2, .deadCalls = 3, .posted = 7, .done = true},
         // The two that it still lacks give the number of a list that there is.
-        {"a file that is lost twice and another that is lost once",
-         [](FakeWebLab& l) {
-             l.losses = {{UploadFormRig::first(), 2}, {UploadFormRig::third(), 1}};
-         },
-         true, 8},
+        {.fault = "lost once and twice", .losses = {{first, 2}, {third, 1}}, .posted = 8, .done = true},
         // Nothing has arrived before, and no list has the number of five.
-        {"the server is back at the third attempt, with more files than there are lists",
-         [](FakeWebLab& l) {
-             l.deadCalls = 9;
-             l.deadPosts = 10;
-         },
-         false, 15, LineStep::List},
+        {.fault = "back at the third attempt", .deadPosts = 10, .deadCalls = 9, .reason = LineStep::List},
+        {.fault = "the same with an order of three files",
+         .deadPosts = 6,
+         .deadCalls = 9,
+         .absent = {sheet, third},
+         .posted = 9,
+         .done = true},
     };
     for (const auto& c : cases) {
         SCOPED_TRACE(c.fault);
         FakeWebLab faulty;
         UploadFormRig other(faulty);
-        c.set(faulty);
+        for (const QString& name : c.absent)
+            ASSERT_TRUE(other.test.files.removeFile(UploadFormRig::folder() / name));
+        faulty.deadPosts = c.deadPosts;
+        faulty.deadCalls = c.deadCalls;
+        faulty.losses = c.losses;
+        faulty.refusesLists = c.refusesLists;
+        faulty.listInstead = c.list;
         UploadForm& page = other.send();
         EXPECT_EQ(page.phase(), c.done ? SendingPhase::Success : SendingPhase::NotAll);
         EXPECT_EQ(page.controls().Image5.visible, !c.done);
         EXPECT_EQ(page.controls().Label1.text, c.done ? QString() : threeAttempts);
         EXPECT_EQ(faulty.reports.size(), c.done ? 2 : 0);
-        EXPECT_EQ(other.localFiles().size(), 5u);
+        EXPECT_EQ(other.localFiles().size(), 5u - c.absent.size());
         EXPECT_EQ(faulty.posted.size(), c.posted);
         if (c.done) {
             EXPECT_EQ(faulty.uploads.at(UploadFormRig::name()), other.localFiles());
@@ -107,20 +110,6 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         EXPECT_EQ(page.controls().Label4Reason.text,
                   LineTroubleText(other.state, c.reason, {}, other.localFiles().rbegin()->first));
     }
-}
-
-TEST_F(UploadFormTest, AServerThatIsBackAtTheThirdAttemptTakesAnOrderOfThreeFiles) {
-    for (const QString& name : {UploadFormRig::sheet(), UploadFormRig::third()})
-        ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() / name));
-    // Three calls of the check at load and of each attempt.
-    lab.deadCalls = 9;
-    lab.deadPosts = 6;
-    UploadForm& page = rig.send();
-    EXPECT_TRUE(hasArrived(page.phase()));
-    EXPECT_TRUE(arrived());
-    EXPECT_EQ(lab.posted.size(), 9);
-    EXPECT_EQ(lab.urls.filter(u"filelisthom3.txt"_s).size(), 2);
-    EXPECT_EQ(lab.reports.size(), 2);
 }
 
 TEST_F(UploadFormTest, AReportThatNobodyTakesIsNotRepeatedAndChangesNothing) {
@@ -160,20 +149,6 @@ TEST_F(UploadFormTest, AFileThatNeverCameToTheLineIsNotLaidToTheServer) {
     EXPECT_EQ(page.controls().Label12.text, u"1"_s);
     EXPECT_EQ(page.controls().Label4Reason.text, LineTroubleText(rig.state, LineStep::File, {}, quoted));
     EXPECT_EQ(lab.posted.size(), 5);
-}
-
-TEST_F(UploadFormTest, StopHoldsTheCountAndContinueTakesItUp) {
-    UploadForm& page = rig.start();
-    EXPECT_TRUE(page.counting());
-    page.Command3_Click();
-    EXPECT_FALSE(page.counting() || page.controls().Picture1.visible || page.controls().Command3.visible);
-    EXPECT_TRUE(page.controls().Command10.visible);
-    page.Timer2_Tick();
-    EXPECT_TRUE(lab.posted.isEmpty());
-    page.Command10_Click();
-    EXPECT_FALSE(page.controls().Command10.visible);
-    rig.countDown();
-    EXPECT_TRUE(arrived());
 }
 
 TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
