@@ -44,21 +44,19 @@ TEST(PlainNumber, HasSevenDigitsAndNoExponent) {
     const struct {
         float number;
         const char* text;
-    } cases[] = {
-        {1.05999994F, "1.06"},           {1.29999971F, "1.3"},          {1.47999954F, "1.48"},
-        {1.53999949F, "1.539999"},       {1.59999943F, "1.599999"},     {2.01999903F, "2.019999"},
-        {0.399999976F, "0.4"},           {0.0999999642F, "0.09999996"}, {0.0399999656F, "0.03999997"},
-        {-0.0200000349F, "-0.02000003"}, {-0.14000003F, "-0.14"},       {1.5199995F, "1.52"},
-        {1.55999947F, "1.559999"},       {1.99999905F, "1.999999"},     {0.919999957F, "0.92"},
-        {0.879999936F, "0.8799999"},     {0.0399997756F, "0.03999978"}, {-2.24411494e-07F, "-0.0000002244115"}};
+    } cases[] = {{1.05999994F, "1.06"},
+                 {1.53999949F, "1.539999"},
+                 {0.0999999642F, "0.09999996"},
+                 {-0.0200000349F, "-0.02000003"},
+                 {-2.24411494e-07F, "-0.0000002244115"},
+                 {0, "0"},
+                 {-0.0F, "0"},
+                 {100, "100"},
+                 {16777216.0F, "16777216"},
+                 {0.99999999F, "1"},
+                 {std::numeric_limits<float>::infinity(), "0"}};
     for (const auto& each : cases)
         EXPECT_EQ(PlainNumber(each.number).toStdString(), each.text);
-    EXPECT_EQ(PlainNumber(0), u"0"_s);
-    EXPECT_EQ(PlainNumber(-0.0F), u"0"_s);
-    EXPECT_EQ(PlainNumber(100), u"100"_s);
-    EXPECT_EQ(PlainNumber(16777216.0F), u"16777216"_s);
-    EXPECT_EQ(PlainNumber(0.99999999F), u"1"_s);
-    EXPECT_EQ(PlainNumber(std::numeric_limits<float>::infinity()), u"0"_s);
 }
 
 TEST(HexToDecimal, ReadsSignedNumbersAndAnswers00ForTheRest) {

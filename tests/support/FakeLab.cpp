@@ -17,15 +17,6 @@ Failure cut() {
     return {Failure::Kind::Disconnected, u"the line was cut"_s};
 }
 
-// True as often as the counter says.
-bool strikes(int& counter) {
-    if (counter > 0)
-        --counter;
-    else if (counter != FakeLab::always)
-        return false;
-    return true;
-}
-
 class FakeConnection : public FtpConnection {
 public:
     explicit FakeConnection(FakeLab& lab)
@@ -75,7 +66,7 @@ public:
             return cut();
         }
         for (FakeLab::PutFault& fault : m_lab.putFaults) {
-            if ((!fault.name.isEmpty() && fault.name != remoteName) || !strikes(fault.times))
+            if ((!fault.name.isEmpty() && fault.name != remoteName) || !FakeLab::strikes(fault.times))
                 continue;
             if (fault.cutAfter < 0)
                 return no(u"553 Could not create file."_s);
@@ -99,14 +90,13 @@ public:
     Result<void> remove(const QString& remoteName) override {
         if (isCut())
             return cut();
-        m_lab.deletes += remoteName;
         if (m_lab.refusesDelete || m_lab.folders[m_here].erase(remoteName) == 0)
             return no(u"550 Delete operation failed."_s);
         return {};
     }
 
     Result<FtpListing> list(const QString& pattern, EmptyFolder empty) override {
-        if (isCut() || strikes(m_lab.failedListings)) {
+        if (isCut() || FakeLab::strikes(m_lab.failedListings)) {
             m_cut = true;
             return cut();
         }
@@ -157,6 +147,14 @@ private:
 };
 
 } // namespace
+
+bool FakeLab::strikes(int& counter) {
+    if (counter > 0)
+        --counter;
+    else if (counter != always)
+        return false;
+    return true;
+}
 
 bool FakeLab::open() {
     return !strikes(deadOpens);

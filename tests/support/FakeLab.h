@@ -20,6 +20,8 @@ public:
     std::map<QString, Folder> folders = {{QString(), {}}};
 
     static constexpr int always = -1;
+    // True as often as the counter says.
+    static bool strikes(int& counter);
 
     // How often from now on; always is for good.
     int deadOpens = 0;    // the machine has no way out
@@ -48,8 +50,7 @@ public:
     std::function<void(int number)> onConnect;
 
     // What the server saw.
-    QStringList puts;    // names, also of puts that failed
-    QStringList deletes; // names
+    QStringList puts; // names, also of puts that failed
     int connects = 0;
     int aborts = 0;   // each cuts the connections that stand then
     QStringList urls; // in order, as the client gave them

@@ -10,14 +10,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-bool strikes(int& counter) {
-    if (counter > 0)
-        --counter;
-    else if (counter != FakeLab::always)
-        return false;
-    return true;
-}
-
 Failure down() {
     return {Failure::Kind::Disconnected, u"nobody answers"_s};
 }

@@ -4,6 +4,7 @@
 #include <Poco/Net/StreamSocket.h>
 #include <Poco/Timespan.h>
 
+#include <QDir>
 #include <QElapsedTimer>
 #include <QFile>
 #include <QThread>
@@ -44,12 +45,20 @@ bool answers(quint16 port) {
 bool ComesUp(QProcess& server, quint16 port) {
     QElapsedTimer waiting;
     waiting.start();
-    while (server.state() != QProcess::NotRunning && waiting.elapsed() < 20'000) {
+    while (server.state() != QProcess::NotRunning && waiting.elapsed() < 60'000) {
         if (answers(port))
             return true;
         server.waitForFinished(20);
     }
     return false;
+}
+
+std::map<QString, QByteArray> FilesIn(const HostPath& folder) {
+    std::map<QString, QByteArray> bytes;
+    const QDir listed(toText(folder));
+    for (const QString& name : listed.entryList(QDir::Files))
+        bytes[name] = contentOf(toHostPath(listed.filePath(name)));
+    return bytes;
 }
 
 quint16 FreePort() {
@@ -76,7 +85,7 @@ LabServers::LabServers() {
 LabServers::~LabServers() {
     QProcess stop;
     stop.start(script("stop"), {m_folder.path()});
-    stop.waitForFinished(20'000);
+    stop.waitForFinished(60'000);
     // Names of bytes that are no text are beyond the temporary folder's own removal.
     std::error_code error;
     std::filesystem::remove_all(folder(), error);
@@ -86,7 +95,7 @@ QByteArrayList LabServers::requests(int atLeast) const {
     QElapsedTimer waiting;
     waiting.start();
     QByteArrayList lines = linesOf(folder() / "requests.log");
-    while (lines.size() < atLeast && waiting.elapsed() < 5'000) {
+    while (lines.size() < atLeast && waiting.elapsed() < 60'000) {
         QThread::msleep(10);
         lines = linesOf(folder() / "requests.log");
     }

@@ -7,6 +7,8 @@
 #include <QString>
 #include <QTemporaryDir>
 
+#include <map>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -36,9 +38,8 @@ public:
     // What the account sees as "/", and the folder that orders arrive in.
     HostPath account() const { return folder() / "ftp"; }
     HostPath ordersFolder() const { return account() / "zalamim234"; }
-    // The folder that orders arrive in which come by HTTP, and the lab's site folder for them.
+    // The folder that orders arrive in which come by HTTP.
     HostPath uploads() const { return folder() / "uploads"; }
-    static QString siteFolder() { return u"hazmanot"_s; }
     HostPath folder() const { return toHostPath(m_folder.path()); }
     HostPath labFile() const { return folder() / "lab.ini"; }
 
@@ -80,6 +81,9 @@ private:
 // Waits until the server answers on its port; false when it ended, as on a port that another took meanwhile, or never
 // answered.
 bool ComesUp(QProcess& server, quint16 port);
+
+// The plain files of a folder by name; none if the folder isn't there.
+std::map<QString, QByteArray> FilesIn(const HostPath& folder);
 
 // A port of 127.0.0.1 on which nothing listens at the moment.
 quint16 FreePort();

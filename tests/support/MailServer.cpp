@@ -21,7 +21,7 @@ QStringList asRoot(const QStringList& command) {
 QByteArray outputOf(QStringList command) {
     QProcess process;
     process.start(command.takeFirst(), command);
-    return process.waitForFinished(20'000) ? process.readAllStandardOutput() : QByteArray();
+    return process.waitForFinished(60'000) ? process.readAllStandardOutput() : QByteArray();
 }
 
 // In the open the server asks for a proof and takes the password too; encrypted it takes the password alone, in one way
@@ -151,7 +151,7 @@ bool MailServer::makeCertificate() {
                   {u"req"_s, u"-x509"_s, u"-newkey"_s, u"ec"_s, u"-pkeyopt"_s, u"ec_paramgen_curve:prime256v1"_s,
                    u"-nodes"_s, u"-days"_s, u"2"_s, u"-subj"_s, u"/CN=lab"_s, u"-addext"_s,
                    u"subjectAltName=IP:127.0.0.1"_s, u"-keyout"_s, key, u"-out"_s, authority()});
-    if (!openssl.waitForFinished(20'000) || openssl.exitCode() != 0) {
+    if (!openssl.waitForFinished(60'000) || openssl.exitCode() != 0) {
         m_failure = u"openssl made no certificate: "_s + QString::fromUtf8(openssl.readAll());
         return false;
     }
@@ -174,7 +174,7 @@ QByteArray MailServer::mailbox() const {
     // The server takes a message first and lays it into the box then.
     QElapsedTimer waiting;
     waiting.start();
-    while (waiting.elapsed() < 5'000 && log().count(" <= ") > log().count(" Completed\n"))
+    while (waiting.elapsed() < 60'000 && log().count(" <= ") > log().count(" Completed\n"))
         QThread::msleep(20);
     return outputOf(asRoot({u"cat"_s, m_folder.filePath(u"box/orders"_s)}));
 }

@@ -94,7 +94,7 @@ QStringList OtherFtpServer::prepareProFtpd() {
         u"ServerName lab\nServerType standalone\nDefaultAddress 127.0.0.1\nSocketBindTight on\nPort %1\n"
         "UseIPv6 off\nUseReverseDNS off\nUser nobody\nGroup nogroup\nRootLogin on\nRequireValidShell off\n"
         "AuthOrder mod_auth_file.c\nAuthUserFile %2/passwd\nAuthGroupFile %2/group\nAllowOverwrite on\n"
-        "WtmpLog off\nDelayEngine off\nPidFile %2/pid\nSystemLog %2/log\nScoreboardFile %2/score\n"
+        "TimeoutLinger 60\nWtmpLog off\nDelayEngine off\nPidFile %2/pid\nSystemLog %2/log\nScoreboardFile %2/score\n"
         "<IfModule mod_ctrls.c>\nControlsEngine off\n</IfModule>\n"_s.arg(QString::number(m_port), m_folder.path());
     if (::getuid() != 0)
         text.replace(u"User nobody\nGroup nogroup\n"_s,

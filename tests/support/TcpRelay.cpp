@@ -128,11 +128,6 @@ void TcpRelay::acceptLoop() {
         const int client = ::accept4(m_listener, nullptr, nullptr, SOCK_CLOEXEC);
         if (client < 0)
             continue;
-        ++m_connections;
-        if (faults().refuseConnections && due()) {
-            reset(client);
-            continue;
-        }
         spawn(std::thread([this, client] {
             if (m_kind == Kind::Ftp) {
                 control(client);

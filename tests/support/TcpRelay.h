@@ -30,9 +30,8 @@ public:
         QByteArray closingReply = {};  // comes in place of the 226
         bool serverSeesEnd = false;    // with cutDataAfter: the server's side of the cut is an orderly end
         bool manyLines = false;        // every reply comes in three lines
-        bool refuseConnections = false;
-        QByteArray command = {};   // with cutAtCommand or reply: "STOR"
-        bool cutAtCommand = false; // the control connection is reset when the command comes, which is not passed on
+        QByteArray command = {};       // with cutAtCommand or reply: "STOR"
+        bool cutAtCommand = false;     // the control connection is reset when the command comes, which is not passed on
         QByteArray reply = {}; // answered in place of the server, which never hears the command: "552 Quota exceeded"
         int times = -1;        // so many faults, then a good line; -1: for ever
     };
@@ -48,7 +47,6 @@ public:
     // For what happens from now on.
     void setFaults(const Faults& faults);
     int faultsMade() const { return m_made; }
-    int connections() const { return m_connections; }
     // The command lines that clients sent, without their line ends.
     QByteArrayList commands() const;
 
@@ -69,7 +67,6 @@ private:
     int m_listener = -1;
     std::atomic<bool> m_stop = false;
     std::atomic<int> m_made = 0;
-    std::atomic<int> m_connections = 0;
     mutable std::mutex m_mutex;
     Faults m_faults;
     QByteArrayList m_commands;

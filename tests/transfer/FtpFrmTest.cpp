@@ -65,6 +65,8 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         EXPECT_EQ(page.AllDone(), success ? 1 : 0);
         EXPECT_EQ(shown.Label3.text, each.status);
         EXPECT_EQ(shown.Picture6.visible, each.end == SendingPhase::NotAll);
+        EXPECT_EQ(shown.Label34.visible && shown.Label34.text.startsWith(u"נסיון רביעי"_s),
+                  each.end == SendingPhase::NotAll);
         EXPECT_EQ(shown.Command10.visible, !hasArrived(each.end));
         EXPECT_EQ(line.lab.urls.size(), success ? 3 : 0);
         EXPECT_EQ(line.rig.test.dialogs.messages.size(), each.end == SendingPhase::Stopped ? 2 : 0);

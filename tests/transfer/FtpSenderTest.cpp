@@ -176,6 +176,14 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
          Success, 1, 3},
         {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, NotAll, 4, 3},
         {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, NotAll, 4, 0},
+        {"login refused", [](Line& line) { line.lab.refusedLogins = FakeLab::always; }, NotAll, 4, 0},
+        {"put refused once",
+         [](Line& line) {
+             line.lab.putFaults = {{u"01a.jpp"_s, 1, -1}};
+         },
+         Success, 2, 4},
+        // Each attempt reaches for the server five times for each file and five times for the check.
+        {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
         {"cut, and the remains can't be deleted",
          [](Line& line) {

@@ -4,8 +4,6 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
-
 namespace lumora {
 namespace {
 
@@ -37,20 +35,16 @@ TEST_F(UploadFormTest, AResendIsNotReportedAndAnOrderThatIsThereIsNotSent) {
 }
 
 TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
-    const auto lost = [](int times, const QStringList& names) {
-        std::map<QString, int> losses;
-        for (const QString& name : names)
-            losses[name] = times;
-        return losses;
-    };
-    const auto [log, sheet, first, second, third] =
-        std::array{UploadFormRig::log(), UploadFormRig::sheet(), UploadFormRig::first(), UploadFormRig::second(),
-                   UploadFormRig::third()};
+    const QString log = UploadFormRig::log();
+    const QString sheet = UploadFormRig::sheet();
+    const QString first = UploadFormRig::first();
+    const QString third = UploadFormRig::third();
+    const QStringList all = {log, sheet, first, UploadFormRig::second(), third};
     struct Case {
         const char* fault;
         int deadPosts = 0;
         int deadCalls = 0;
-        std::map<QString, int> losses = {};
+        QStringList lost = {}; // at an upload for each time that a name stands here
         bool refusesLists = false;
         std::optional<QByteArray> list = {};
         QStringList absent = {}; // not in this order
@@ -64,17 +58,17 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
          .deadCalls = FakeLab::always,
          .reason = LineStep::Put},
         {.fault = "no line to the list", .deadCalls = FakeLab::always, .reason = LineStep::List},
-        {.fault = "a script that fails", .losses = lost(FakeLab::always, {log, sheet, first, second, third})},
+        {.fault = "a script that fails", .lost = all + all + all},
         {.fault = "no list is given out", .refusesLists = true},
         {.fault = "a list without a total", .list = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp"},
         {.fault = "a short list", .list = "total:5"},
         {.fault = "four files lost, and no list has their number",
-         .losses = lost(1, {log, first, second, third}),
+         .lost = {log, first, UploadFormRig::second(), third},
          .posted = 14},
         // The load's check takes three calls, that of an attempt three.
         {.fault = "back at the second attempt", .deadPosts = 2, .deadCalls = 3, .posted = 7, .done = true},
         // The two that it still lacks give the number of a list that there is.
-        {.fault = "lost once and twice", .losses = {{first, 2}, {third, 1}}, .posted = 8, .done = true},
+        {.fault = "lost once and twice", .lost = {first, first, third}, .posted = 8, .done = true},
         // Nothing has arrived before, and no list has the number of five.
         {.fault = "back at the third attempt", .deadPosts = 10, .deadCalls = 9, .reason = LineStep::List},
         {.fault = "the same with an order of three files",
@@ -92,7 +86,8 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
             ASSERT_TRUE(other.test.files.removeFile(UploadFormRig::folder() / name));
         faulty.deadPosts = c.deadPosts;
         faulty.deadCalls = c.deadCalls;
-        faulty.losses = c.losses;
+        for (const QString& name : c.lost)
+            ++faulty.losses[name];
         faulty.refusesLists = c.refusesLists;
         faulty.listInstead = c.list;
         UploadForm& page = other.send();

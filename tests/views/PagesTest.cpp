@@ -156,7 +156,7 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     const ControlFinder finder(walk.program().window());
     const auto lookAtRest = [&](const QString& name) {
         const AlbumControls& album = walk.page<nnn>(PageId::nnn).album().controls();
-        EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }));
+        EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }, 60000));
         look(walk, name);
     };
     walk.type(u"nnn"_s, u"Text1(0)"_s, u"Studio Or"_s);

@@ -88,7 +88,7 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
     look(walk, u"01-start-advert-closing"_s);
 
     walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
     look(walk, u"01-start-shops"_s);
     walk.press(u"hatchala"_s, u"shopsBack"_s);
     EXPECT_FALSE(page.controls().Picture1.visible);
@@ -166,7 +166,7 @@ TEST(StartPage, ThePanelOfTheShopsUnfoldsAnswersAndCloses) {
     Walk walk({1024, 768}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
     hatchala& page = startPage(walk);
     walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
     EXPECT_EQ(page.motion().Picture1Width(), StartMotion::panelWidth);
     EXPECT_FALSE(page.timers().Timer5.running());
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
@@ -175,7 +175,7 @@ TEST(StartPage, ThePanelOfTheShopsUnfoldsAnswersAndCloses) {
     EXPECT_TRUE(page.timers().Timer5.running());
 
     walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
     const Result<void> chosen =
         ControlFinder(walk.program().window()).choose(u"hatchala"_s, u"List1"_s, page.controls().List1.item(1));
     ASSERT_TRUE(chosen.ok()) << qPrintable(chosen.failure().message);

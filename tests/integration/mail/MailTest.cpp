@@ -61,13 +61,10 @@ protected:
         return toHostPath(file.fileName());
     }
 
-    // The code of the end and the customer's words for it; said stands in what is told for a log.
-    void expectEnd(int code, const MailAccount& account, const char* said, const QString& words = {}) {
+    // The code of the end; said stands in what is told for a log.
+    void expectEnd(int code, const MailAccount& account, const char* said) {
         const MailOutcome outcome = mail.send(account, message);
         EXPECT_EQ(MailResultCode(outcome.end), code) << outcome.words.toStdString();
-        if (!words.isEmpty()) {
-            EXPECT_EQ(MailResultText(MailResultCode(outcome.end), false).toStdString(), words.toStdString());
-        }
         EXPECT_TRUE(outcome.words.contains(QLatin1String(said))) << outcome.words.toStdString();
     }
 
@@ -91,7 +88,7 @@ TEST_F(MailTest, AFileArrivesByteForByteWithSubjectBodyAndName) {
         QProcess reading;
         reading.setProcessChannelMode(QProcess::MergedChannels);
         reading.start(u"/usr/bin/python3"_s, {u"-c"_s, QString::fromUtf8(mailProgram), box, folder.path()});
-        ASSERT_TRUE(reading.waitForFinished(20'000));
+        ASSERT_TRUE(reading.waitForFinished(60'000));
         ASSERT_EQ(reading.exitCode(), 0) << reading.readAll().toStdString();
         EXPECT_EQ(contentOf(folder.filePath(u"subject"_s)), message.subject.toUtf8());
         EXPECT_EQ(QString::fromUtf8(contentOf(folder.filePath(u"body"_s))).remove(u'\r'), message.body);
@@ -114,25 +111,25 @@ TEST_F(MailTest, EachRefusalHasItsCode) {
 
     MailAccount wrong = server.account();
     wrong.to = u"nobody@lab.example"_s;
-    expectEnd(14, wrong, "Unrouteable", u"השם שהוקלד בחלונית הכתובת אינו מדוייק על כן הקלד כתובת במדוייק"_s);
+    expectEnd(14, wrong, "Unrouteable");
     wrong = server.account();
     wrong.to = u"orders@lab.example>\r\nRCPT TO:<else@else.example"_s;
     expectEnd(14, wrong, "no mail address");
     wrong = server.account();
     wrong.password = u"guessed"_s;
-    expectEnd(6, wrong, "535", u"הגישה נדחתה"_s);
+    expectEnd(6, wrong, "535");
     EXPECT_FALSE(mail.send(wrong, message).words.contains(wrong.password));
-    expectEnd(4, full.account(), "452", u"הדיסק ללא מקופ פנוי המספיק לביצוע המשלוח"_s);
+    expectEnd(4, full.account(), "452");
     wrong = server.account();
     wrong.port = FreePort();
-    expectEnd(3, wrong, "refused", u" תוכנת הדואר לא הוגדרה כראוי"_s + u"המחשב לא יצר קשר עם שרת הדואר שלך"_s);
+    expectEnd(3, wrong, "refused");
 
     message.attachment = fileOf(MailServer::largestMessage, u"large.jpp"_s);
-    expectEnd(18, server.account(), "552", u"התוכן המילולי ארוך מדי לא נשלחה ההודעה"_s);
+    expectEnd(18, server.account(), "552");
     message.attachment = toHostPath(folder.filePath(u"gone.jpp"_s));
-    expectEnd(11, server.account(), "gone.jpp", u"הקובץ המיועד לשיגור אינו נמצא"_s);
+    expectEnd(11, server.account(), "gone.jpp");
     message.attachment = toHostPath(folder.path());
-    expectEnd(12, server.account(), "", u"הקובץ המיועד לשיגור אינו תקין ואינו ראוי למשלוח"_s);
+    expectEnd(12, server.account(), "");
 
     EXPECT_TRUE((server.mailbox() + full.mailbox()).isEmpty());
 }

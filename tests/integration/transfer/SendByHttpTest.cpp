@@ -9,8 +9,6 @@
 #include <Poco/Net/SocketAddress.h>
 #include <Poco/Net/StreamSocket.h>
 
-#include <QFile>
-
 #include <array>
 #include <atomic>
 #include <filesystem>
@@ -20,19 +18,6 @@
 namespace lumora {
 namespace {
 
-// What a server holds of the order, without the lists.
-std::map<QString, QByteArray> filesIn(const HostPath& folder) {
-    std::map<QString, QByteArray> bytes;
-    std::error_code none;
-    for (const auto& entry : std::filesystem::directory_iterator(folder, none)) {
-        const QString name = toText(entry.path().filename());
-        QFile file(toText(entry.path()));
-        if (!name.startsWith(u"filelist"_s) && file.open(QIODevice::ReadOnly))
-            bytes[name] = file.readAll();
-    }
-    return bytes;
-}
-
 class SendByHttp : public ::testing::Test {
 protected:
     void SetUp() override {
@@ -41,9 +26,16 @@ protected:
         profile.HttpHost = lab.site();
         profile.ReportUrl = lab.site() + u"/aaaqamootreport/padd.asp"_s;
         profile.HttpDoneUrl = lab.site() + u"/aaasssppp/p.asp"_s;
-        rig.write(UploadFormRig::second(), everyByte.repeated(900));
+        rig.write(UploadFormRig::second(), everyByte.repeated(7000));
     }
-    HostPath order(const HostPath& uploads) const { return uploads / UploadFormRig::name().toStdString(); }
+    // The server holds the order and, beside its lists, nothing else.
+    void expectArrived(const HostPath& uploads) {
+        EXPECT_TRUE(hasArrived(rig.page().phase()))
+            << rig.page().controls().Label4Reason.hint.toStdString() << rig.page().controls().TxtWeb.text.toStdString();
+        auto files = FilesIn(uploads / UploadFormRig::name().toStdString());
+        std::erase_if(files, [](const auto& file) { return file.first.startsWith(u"filelist"_s); });
+        EXPECT_TRUE(files == rig.localFiles()) << "the bytes on the server are not those of the folder";
+    }
 
     QByteArray everyByte = [] {
         QByteArray bytes;
@@ -52,15 +44,13 @@ protected:
         return bytes;
     }();
     LabServers lab;
-    PocoInternet internet{TimeLimits{Poco::Timespan(2, 0), Poco::Timespan(5, 0)}};
+    PocoInternet internet;
     UploadFormRig rig{internet};
 };
 
 TEST_F(SendByHttp, TheOrderArrivesByteForByteWithOneReportAndOneDoneCall) {
-    UploadForm& page = rig.send();
-    EXPECT_TRUE(hasArrived(page.phase()))
-        << page.controls().Label4Reason.hint.toStdString() << page.controls().TxtWeb.text.toStdString();
-    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+    rig.send();
+    expectArrived(lab.uploads());
     const QByteArrayList reports = lab.reports();
     ASSERT_EQ(reports.size(), 2);
     EXPECT_TRUE(reports[0].startsWith("REPORT k1=tarvelmond | t1=2026_11_21_KUP_1234^105 "));
@@ -71,10 +61,8 @@ TEST_F(SendByHttp, ASecondKindOfServerTakesTheSameRequest) {
     SecondWebServer second;
     ASSERT_TRUE(second.running()) << second.failure().toStdString();
     rig.state.profile.HttpHost = second.site();
-    UploadForm& page = rig.send();
-    EXPECT_TRUE(hasArrived(page.phase()))
-        << page.controls().Label4Reason.hint.toStdString() << page.controls().TxtWeb.text.toStdString();
-    EXPECT_EQ(filesIn(order(second.uploads())), rig.localFiles());
+    rig.send();
+    expectArrived(second.uploads());
 }
 
 TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
@@ -83,26 +71,7 @@ TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
     rig.start();
     relay.setFaults({.cutDataAfter = 20, .times = 2});
     rig.countDown();
-    EXPECT_TRUE(hasArrived(rig.page().phase())) << rig.page().controls().Label4Reason.hint.toStdString();
-    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
-}
-
-TEST_F(SendByHttp, AServerThatAnswers500EndsInTheThreeAttemptsAndSendAgainStartsAnew) {
-    // Where the order's folder should be lies a file: the script can't store anything.
-    QFile inTheWay(toText(order(lab.uploads())));
-    ASSERT_TRUE(inTheWay.open(QIODevice::WriteOnly));
-    UploadForm& page = rig.send();
-    EXPECT_EQ(page.look().sign, SendingSign::Bad);
-    EXPECT_TRUE(page.controls().Image5.visible);
-    EXPECT_EQ(page.controls().Label12.text, u"5"_s);
-    EXPECT_EQ(page.controls().Label10.text, u"00-0000000"_s);
-    EXPECT_TRUE(lab.reports().isEmpty());
-    EXPECT_EQ(lab.requests().join(" ").count("POST "), 15);
-    ASSERT_TRUE(inTheWay.remove());
-    page.Image5_Click();
-    EXPECT_TRUE(hasArrived(page.phase()));
-    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
-    EXPECT_EQ(lab.reports().size(), 2);
+    expectArrived(lab.uploads());
 }
 
 TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
@@ -129,8 +98,8 @@ TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
     EXPECT_EQ(page.lists().List4Hossarim.count(), 5);
     rig.state.profile.HttpHost = lab.site();
     page.Image5_Click();
-    EXPECT_TRUE(hasArrived(page.phase())) << page.controls().Label4Reason.hint.toStdString();
-    EXPECT_EQ(filesIn(order(lab.uploads())), rig.localFiles());
+    expectArrived(lab.uploads());
+    EXPECT_EQ(lab.reports().size(), 2);
 }
 
 TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
@@ -145,67 +114,16 @@ TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
     EXPECT_TRUE(hasArrived(page.phase()));
 }
 
-TEST_F(SendByHttp, AHebrewNameArrivesInTheCodePageAndNoNameLeadsElsewhere) {
-    UploadScript script(rig.test.platform);
-    const QString url = lab.site() + u"/hazmanot/getfile2.php"_s;
-    rig.write(u"דנה.jpg"_s, "xyz");
-    const auto send = [&](const QString& folder, const QString& name) {
-        return script.MultipartPost(folder, {name}, url, UploadFormRig::folder(), {}, {}, {});
-    };
-    EXPECT_EQ(send(u"tttt"_s, u"דנה.jpg"_s), u"stored\r\n"_s);
-    EXPECT_TRUE(std::filesystem::exists(lab.uploads() / "tttt" / "\xe3\xf0\xe4.jpg"));
-    for (const char* folder : {"..", "../www", "", ".hidden", "a\\b"})
-        EXPECT_NE(send(QString::fromLatin1(folder), UploadFormRig::first()), u"stored\r\n"_s) << folder;
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(lab.uploads()), {}), 1);
-}
-
 TEST_F(SendByHttp, TheTestFormAnnouncesMoreThanItsBodyAndIsTaken) {
     UploadScript script(rig.test.platform);
     const QString host = lab.site().mid(7);
     const QString answer = script.MultipartPostInet(u"tttt"_s, {UploadFormRig::second()}, host,
                                                     u"/hazmanot/getfile2.php"_s, UploadFormRig::folder(), u"v=1"_s);
     EXPECT_EQ(answer, u"stored\r\n"_s);
-    EXPECT_EQ(filesIn(lab.uploads() / "tttt"),
-              (std::map<QString, QByteArray>{{UploadFormRig::second(), everyByte.repeated(900)}}));
+    EXPECT_EQ(FilesIn(lab.uploads() / "tttt"),
+              (std::map<QString, QByteArray>{{UploadFormRig::second(), everyByte.repeated(7000)}}));
     EXPECT_TRUE(lab.requests(1).value(0).endsWith("HTTP/1.0"));
 }
-
-// The address sanitizer's allocator holds on to what was freed, so that there the peak tells nothing.
-#ifndef LUMORA_SANITIZED
-
-// Peak memory of this process, in bytes.
-qint64 peakMemory() {
-    QFile status(u"/proc/self/status"_s);
-    if (!status.open(QIODevice::ReadOnly))
-        return -1;
-    for (const QByteArray& line : status.readAll().split('\n')) {
-        if (line.startsWith("VmHWM:"))
-            return line.mid(6).trimmed().split(' ').value(0).toLongLong() * 1024;
-    }
-    return -1;
-}
-
-TEST_F(SendByHttp, AFileOf20MiBTakesLessThanThreeTimesItsSize) {
-    constexpr qint64 size = 20 * 1024 * 1024;
-    std::filesystem::resize_file(*rig.test.drives.toHost(UploadFormRig::folder() / UploadFormRig::first()), size);
-    UploadScript script(rig.test.platform);
-    QFile reset(u"/proc/self/clear_refs"_s);
-    ASSERT_TRUE(reset.open(QIODevice::WriteOnly));
-    reset.write("5"); // the peak begins anew
-    reset.close();
-    const qint64 before = peakMemory();
-    EXPECT_EQ(script.MultipartPost(u"tttt"_s, {UploadFormRig::first()}, lab.site() + u"/hazmanot/getfile2.php"_s,
-                                   UploadFormRig::folder(), {}, {}, {}),
-              u"stored\r\n"_s);
-    const qint64 taken = peakMemory() - before;
-    RecordProperty("bytes_taken", std::to_string(taken));
-    EXPECT_LT(taken, 3 * size);
-    EXPECT_GT(taken, size) << "the measure is blind";
-    EXPECT_EQ(std::filesystem::file_size(lab.uploads() / "tttt" / UploadFormRig::first().toStdString()),
-              static_cast<std::uintmax_t>(size));
-}
-
-#endif
 
 } // namespace
 } // namespace lumora
