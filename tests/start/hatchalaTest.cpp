@@ -168,15 +168,16 @@ TEST_F(hatchalaTest, TheAdvertisingPictureComesFromTheSiteOrTheInstallationAndMo
     }
     EXPECT_EQ(page.timers().Timer2.interval(), 30);
 
-    chain.unload(PageId::hatchala);
-    hatchala& withoutFolder = start();
     std::filesystem::remove_all(machine.drives.dataFolder() / "2000lumora");
     ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_path, "a file in the way").ok());
-    withoutFolder.Timer1_Tick();
-    EXPECT_EQ(withoutFolder.controls().Picture4, state.profile.AdFile1) << "placed by an installation";
     ASSERT_TRUE(machine.files.removeFile(state.profile.AdFile1).ok());
+    chain.unload(PageId::hatchala);
+    hatchala& withoutFolder = start();
     withoutFolder.Timer1_Tick();
     EXPECT_EQ(withoutFolder.controls().Picture4, DrivePath());
+    ASSERT_TRUE(machine.files.writeWhole(state.profile.AdFile1, "picture").ok());
+    withoutFolder.Timer1_Tick();
+    EXPECT_EQ(withoutFolder.controls().Picture4, state.profile.AdFile1) << "placed by an installation";
     EXPECT_EQ(site.urls.size(), 1) << "nothing is fetched then";
 }
 
