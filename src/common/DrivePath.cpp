@@ -9,11 +9,6 @@ namespace {
 
 constexpr QChar backslash = u'\\';
 
-QString beforeLastBackslash(QStringView path) {
-    const qsizetype at = path.lastIndexOf(backslash);
-    return at < 0 ? notChosen : path.left(at).toString();
-}
-
 } // namespace
 
 QString DrivePath::leaf() const {
@@ -26,12 +21,9 @@ QString DrivePath::stem() const {
     return name.chopped(std::min<qsizetype>(4, name.size()));
 }
 
-DrivePath DrivePath::parent() const {
-    return DrivePath(beforeLastBackslash(QStringView(m_text).chopped(m_text.endsWith(backslash) ? 1 : 0)));
-}
-
 DrivePath DrivePath::folder() const {
-    return DrivePath(m_text.size() < 3 ? notChosen : beforeLastBackslash(m_text));
+    const qsizetype at = m_text.lastIndexOf(backslash);
+    return DrivePath(at < 0 || m_text.size() < 3 ? notChosen : m_text.left(at));
 }
 
 DrivePath DrivePath::operator/(QStringView name) const {

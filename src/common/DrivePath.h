@@ -22,8 +22,6 @@ public:
     QString leaf() const;
     // The leaf less its last four characters: the base name of a print file.
     QString stem() const;
-    // The folder of the path, also of one that ends in a backslash; "***" when there is none.
-    DrivePath parent() const;
     // What stands before the last backslash; "***" when there is none and for a path of under 3 characters.
     DrivePath folder() const;
 

@@ -28,6 +28,12 @@ QStringList numbersOfUnfinished(const SessionState& state, const Files& files) {
     return numbers;
 }
 
+// The folder of the orders, and the one that it lies in.
+Result<void> makeFolders(const Files& files, const DrivePath& orders) {
+    Result<void> made = files.makeFolder(orders.folder());
+    return made ? files.makeFolder(orders) : made;
+}
+
 } // namespace
 
 OrderFolder OrderFolder::chosen(const SessionState& state) {
@@ -51,11 +57,8 @@ DrivePath OrderFolder::filePath(const QString& fileName) const {
 }
 
 Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, OrderFolder::Ending ending) {
-    const DrivePath orders = WorkspacePaths::orders(state);
-    for (const DrivePath& path : {orders.parent(), orders}) {
-        if (const Result<void> made = files.makeFolder(path); !made)
-            return made.failure();
-    }
+    if (const Result<void> made = makeFolders(files, WorkspacePaths::orders(state)); !made)
+        return made.failure();
     const QStringList taken = numbersOfUnfinished(state, files);
     for (QString number = state.MisparHazmana;; number = QString::number(Val(number) + 1.0, 'f', 0)) {
         if (taken.contains(number))
@@ -72,14 +75,8 @@ Result<OrderFolder> claimOrderFolder(SessionState& state, const Files& files, Or
 }
 
 Result<void> makeOrderFolder(const Files& files, const OrderFolder& folder) {
-    const DrivePath orders = folder.path().parent();
-    for (const DrivePath& path : {orders.parent(), orders, folder.path()}) {
-        if (files.folderExists(path))
-            continue;
-        if (Result<void> made = files.makeFolder(path); !made)
-            return made;
-    }
-    return {};
+    Result<void> made = makeFolders(files, folder.path().folder());
+    return made ? files.makeFolder(folder.path()) : made;
 }
 
 } // namespace lumora

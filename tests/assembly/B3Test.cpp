@@ -109,7 +109,7 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
     // What an earlier customer's order left behind.
     ASSERT_TRUE(Bitmap(40, 30, Qt::blue).image().save(hostText(bw), "BMP"));
     giveCorrected(bw.text(), Qt::blue);
-    makeFolder(folder().parent());
+    makeFolder(folder().folder());
     giveFile(u"old.jpg"_s, *encodeJpeg(Bitmap(40, 30, Qt::blue), 90));
     ASSERT_TRUE(machine.files.copyFile(u"C:\\pics\\old.jpg"_path, u"C:\\2000lumora\\!!000\\^^^.jpg"_path));
     const QStringList failed = prepare({edited(damaged, record(toned)), edited(good, record(toned)),

@@ -92,7 +92,7 @@ TEST_F(WorkSurfaces, TurnGreyWithEqualWeightsOnceAPictureIsThere) {
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
     auto& look = chain.load<Form3>();
     const QString path = picture("look.bmp", halves(1000, 500, Qt::red, Qt::blue));
-    look.open(path);
+    look.open(DrivePath(path));
     // Red lies left, on top, right, below: a quarter turn clockwise each time, and upright again after four.
     struct Case {
         int angle;

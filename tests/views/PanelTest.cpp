@@ -19,12 +19,16 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-struct PanelPage : Page {
+struct PanelControls : Controls {
+    Caption Command1{*this, u"Command1"};
+};
+
+struct PanelPage : Page, PanelControls {
     PanelPage()
         : Page(PageId::SpltForm) {
         Command1.text = u"Close"_s;
     }
-    Caption Command1;
+    const Controls& controls() const override { return *this; }
     int presses = 0;
 };
 
@@ -33,7 +37,7 @@ class PanelView : public PageView {
 public:
     PanelView(PanelPage& page, const SessionState& state, const Theme& theme)
         : PageView(page, state, theme) {
-        m_close = button(u"Command1"_s, page.Command1, Role::Main, [&page] { ++page.presses; });
+        m_close = button(page.Command1, Role::Main, [&page] { ++page.presses; });
         frame().content()->addStretch(1);
         frame().content()->addWidget(m_close);
         frame().content()->addSpacing(theme.px(240));

@@ -25,7 +25,7 @@ TEST_P(PiecesLook, ThePageOfPieces) {
     EXPECT_TRUE(walk.program().state().SplitPage);
     const Files& files = walk.program().platform().files;
     const DrivePath order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_path;
-    for (const DrivePath& folder : {order.parent().parent(), order.parent(), order})
+    for (const DrivePath& folder : {order.folder().folder(), order.folder(), order})
         ASSERT_TRUE(files.makeFolder(folder).ok());
     for (int i = 1; i <= 6; ++i)
         ASSERT_TRUE(

@@ -1,6 +1,5 @@
 #include "editing/editor/Form3.h"
 
-#include "common/DrivePath.h"
 #include "imaging/drawing/Drawing.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
@@ -38,9 +37,10 @@ void Form3::setTexts() {
     Q_EMIT changed();
 }
 
-void Form3::open(const QString& path) {
-    Label1.text = path;
-    fileName.text = LeafName(path);
+void Form3::open(const DrivePath& path) {
+    m_path = path;
+    Label1.text = path.text();
+    fileName.text = path.leaf();
     angle = 0;
     draw();
 }
@@ -67,9 +67,9 @@ void Form3::draw() {
 }
 
 Result<Bitmap> Form3::read() {
-    const std::optional<HostPath> file = m_platform.files.drives().toHost(DrivePath(Label1.text));
+    const std::optional<HostPath> file = m_platform.files.drives().toHost(m_path);
     if (!file)
-        return Failure{Failure::Kind::NotFound, Label1.text};
+        return Failure{Failure::Kind::NotFound, m_path.text()};
     const auto size = readPictureSize(*file);
     if (!size)
         return size.failure();

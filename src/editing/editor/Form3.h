@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 #include "imaging/Bitmap.h"
 #include "imaging/files/PictureFile.h"
@@ -36,7 +37,7 @@ public:
 
     // --- events ---
 
-    void open(const QString& path); // a drive path, upright; who opens it brings the page to the front
+    void open(const DrivePath& path); // shows the picture upright; the caller brings the page to the front
     void Command1_Click() { turn(); }
     void Command2_Click() { draw(); }
     void Command3_Click() { close(); }
@@ -54,6 +55,7 @@ private:
     const SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
+    DrivePath m_path; // of the picture
 };
 
 } // namespace lumora

@@ -82,11 +82,8 @@ void tFrmNew::tell(const QString& hebrew, const QString& english, const QString&
 }
 
 void tFrmNew::hidePanels() {
-    if (!Frame3.visible && !Frame4.visible)
-        return;
-    Frame3.visible = false;
-    Frame4.visible = false;
-    Q_EMIT changed();
+    if (m_panel != Panel::None)
+        open(Panel::None);
 }
 
 // --- opening ---
@@ -327,15 +324,10 @@ void tFrmNew::turnHints() {
     setTexts();
 }
 
-void tFrmNew::showTones() {
-    Frame3.visible = true;
-    Frame4.visible = false;
-    Q_EMIT changed();
-}
-
-void tFrmNew::showTurns() {
-    Frame4.visible = true;
-    Frame3.visible = false;
+void tFrmNew::open(Panel panel) {
+    m_panel = panel;
+    Frame3.visible = panel == Panel::Tones;
+    Frame4.visible = panel == Panel::Turns;
     Q_EMIT changed();
 }
 

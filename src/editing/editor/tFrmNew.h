@@ -119,8 +119,8 @@ public:
     void Image12_Click() { takeTone(Tone::Blue); }
     void Image9_Click() { takeTone(Tone::Green); }
     void Image5_Click() { backToColour(); }
-    void Image13_MouseMove() { showTones(); } // over the button of the tones, or pressed
-    void Image15_MouseMove() { showTurns(); } // over the quarter turn
+    void Image13_MouseMove() { open(Panel::Tones); } // over the button of the tones, or pressed
+    void Image15_MouseMove() { open(Panel::Turns); } // over the quarter turn
 
     void Combo4_Click(int index) { chooseCategory(index); }
     void Combo2_Click(int index) { chooseFrame(index); }
@@ -168,6 +168,7 @@ Q_SIGNALS:
 private:
     enum class Held { Closer, Further, Darker, Lighter, Right, Left, Up, Down, TurnRight, TurnLeft };
     enum class Release { MouseUp, Lost };
+    enum class Panel { None, Tones, Turns }; // Frame3, Frame4
 
     // The way out of the page, and looking.
     void pickAnotherPicture();
@@ -176,8 +177,7 @@ private:
     void choosePaper(const QString& code) { PaperSizeCode = code; }
     void measureLevels();
     void lookQuickly();
-    void showTones();
-    void showTurns();
+    void open(Panel panel);
     void hidePanels();
     void markCorners();
     void markInset();
@@ -270,6 +270,7 @@ private:
     HeldButton m_held;
     int m_step = 0; // of the held button, a tick
     bool m_open = false;
+    Panel m_panel = Panel::None;
     unsigned m_openings = 0;
     bool m_workFileFailed = false;
     bool m_drawnSinceTaken = false;

@@ -36,7 +36,7 @@ void tFrmNew::PlaceTextLabel() {
 }
 
 void tFrmNew::beginCaptionDrag(QPointF at) {
-    if (!m_open || !Labeltext.visible)
+    if (!m_open || m_edit.TextOn != 1)
         return;
     m_labelHandle.put({LabeltextBox.left, LabeltextBox.top});
     m_labelHandle.press(at);

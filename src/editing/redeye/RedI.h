@@ -11,6 +11,8 @@
 
 #include <QPointF>
 
+#include <optional>
+
 namespace lumora {
 
 struct EditFields;
@@ -186,7 +188,8 @@ private:
     RedEyePicture m_picture;
     int m_sizeStep = 0;
     DragHandle m_drag;
-    QPointF m_pressed; // where the drag began
+    QPointF m_pressed;                     // where the drag began
+    std::optional<float> m_averageRedness; // of the patch that was last corrected by hand
     bool m_dragged = false;
     Ticker Timer1, Timer2, Timer3, Timer4, Timer5, Timer7;
     HeldButton m_held;

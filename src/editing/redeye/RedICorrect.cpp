@@ -24,7 +24,7 @@ void RedI::RedFix(int level) {
     markCorrected();
 }
 
-// The level stays: each press goes deeper.
+// The level stays, so that each press goes deeper.
 void RedI::deepen() {
     constexpr int deeper = 10;
     kofez.visible = false;
@@ -68,7 +68,7 @@ void RedI::findPeak() {
 void RedI::takePatch() {
     constexpr int besidePatch = 40;
     if (m_picture.takePatch(m_sight.circle()))
-        forgetLists(); // its points are those of another patch
+        forgetLists(); // they hold points of another patch
     const QRect patch = m_picture.patchPlace;
     Frame6.visible = false;
     Frame6Place = {patch.left() + patch.width() + besidePatch, patch.top() - besidePatch};
@@ -89,7 +89,8 @@ void RedI::correctByHand(int passes, QPoint meant) {
     takePatch();
     const RedEye::PatchStats stats = m_picture.correctByHand(passes, meant);
     Label13.text = QString::number(stats.peak.redness);
-    Label16.text = PlainNumber(static_cast<float>(stats.averageRedness));
+    m_averageRedness = static_cast<float>(stats.averageRedness);
+    Label16.text = PlainNumber(*m_averageRedness);
     Label17.text = PlainNumber(static_cast<float>(stats.averageBrightness));
     Image1.visible = false;
     markCorrected();
@@ -243,10 +244,11 @@ void RedI::readPatch(QPoint pixel) {
         return;
     const QRgb value = m_picture.Picture7.image().pixel(pixel);
     showPixel(value, pixel + m_picture.patchPlace.topLeft());
-    Label6.text = QString::number(RedEye::redness(value));
-    Label6Order = Label16.text.isEmpty()                  ? Order::Unknown
-                  : Val(Label6.text) >= Val(Label16.text) ? Order::InOrder
-                                                          : Order::OutOfOrder;
+    const int redness = RedEye::redness(value);
+    Label6.text = QString::number(redness);
+    Label6Order = !m_averageRedness                                  ? Order::Unknown
+                  : static_cast<float>(redness) >= *m_averageRedness ? Order::InOrder
+                                                                     : Order::OutOfOrder;
 }
 
 QString RedI::readings() const {

@@ -41,7 +41,7 @@ void AlbumPanels::begin() {
     Combo4Mail.fill(mailDomains(), mailDomainPrompt(english()));
     greyKinds();
     m_kind = -1;
-    Label17.text = notChosen;
+    Label17.text = kindName();
     addParents(false);
     Combo4Horim.fill({}, promptOf(AlbumChoice::ParentSize));
     Label36.text.clear();
@@ -80,7 +80,7 @@ void AlbumPanels::take(ComboCaption& list, int row) {
 
 // --- who ---
 
-void AlbumPanels::Text1_Change(int box, const QString& text) {
+void AlbumPanels::type(int box, const QString& text) {
     Text1.at(static_cast<std::size_t>(box)).text = text;
     Q_EMIT changed();
 }
@@ -138,7 +138,7 @@ void AlbumPanels::takeKind(int kind) {
     SoogAlb[at].shade = blue;
     SoogAlb[at].checked = true;
     m_kind = kind;
-    Label17.text = Label28[at].text;
+    Label17.text = kindName();
     // Each kind that is looked at adds its five sizes to those that are there.
     Combo4Horim.fill(Combo4Horim.rows.items() + itemsOf(AlbumChoice::ParentSize), promptOf(AlbumChoice::ParentSize));
     Label36.text.clear();
@@ -218,17 +218,18 @@ void AlbumPanels::finish() {
 
 // Copies all fields of the panels into the session and writes the bill from them.
 void AlbumPanels::gather() {
-    AlbumDetails album; // of an album before nothing stays
+    AlbumDetails album; // nothing of an earlier album stays
     album.ShemZalam = Text1[0].text.trimmed();
     album.TelZalam = Text1[1].text.trimmed();
     album.ShemErooa = Text1[2].text.trimmed();
     album.MailZalam = mailAddress();
-    album.SoogLBM = Label17.text;
+    album.SoogLBM = kindName();
     album.SoogKricha = Combo4Cricha.text;
     album.SoogNiar = Combo4Niyar.text;
     album.Tosafot1[0] = Combo4Tosefet.text;
+    const QStringList extras = itemsOf(AlbumChoice::SpecialExtra);
     for (std::size_t i = 0; i < Check3.size(); ++i)
-        album.Tosafot2[i] = Check3[i].text + u'=' + QString::number(Check3[i].checked ? 1 : 0);
+        album.Tosafot2[i] = extras[static_cast<qsizetype>(i)] + u'=' + QString::number(Check3[i].checked ? 1 : 0);
     album.GodelLBM = Combo4Godel.text;
     album.KamutHorim = QString::number(m_copies);
     album.SoogHorim = Combo4Horim.rows.currentItem();

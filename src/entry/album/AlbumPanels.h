@@ -34,7 +34,7 @@ public:
 
     // --- events ---
 
-    void Text1_Change(int box, const QString& text);
+    void Text1_Change(int box, const QString& text) { type(box, text); }
     void Combo4Mail_Change(const QString& text) { typeDomain(text); }
     void Combo4Mail_Click(int row) { take(Combo4Mail, row); }
     void Check5_Click(bool checked) { tick(Check5, checked); } // remember the photographer
@@ -89,6 +89,7 @@ private:
 
     void tick(CheckCaption& box, bool checked);
     void take(ComboCaption& list, int row);
+    void type(int box, const QString& text);
     void typeDomain(const QString& text);
     void recallPhotographer();
     void leavePhotographer();
@@ -109,6 +110,7 @@ private:
     void slide(int& shift, Ticker& timer);
     void stopSliding();
     QString mailAddress() const;
+    QString kindName() const; // "***" before a kind is taken
     QString promptOf(AlbumChoice choice) const { return albumPrompt(choice, english()); }
     QStringList itemsOf(AlbumChoice choice) const { return albumItems(choice, english()); }
     bool english() const;
@@ -118,7 +120,7 @@ private:
     Ticker Timer4Alboom;
     Ticker Timer7;
     Panel m_panel = Panel::Photographer;
-    int m_kind = -1;  // index of the kind that Label17 names
+    int m_kind = -1;  // index of the kind that is taken
     int m_copies = 0; // for the parents
 };
 

@@ -82,7 +82,7 @@ void AlbumPanels::setTexts() {
     const QStringList kinds = itemsOf(AlbumChoice::Kind);
     for (std::size_t i = 0; i < SoogAlb.size(); ++i)
         SoogAlb[i].text = Label28[i].text = kinds[static_cast<qsizetype>(i)];
-    Label17.text = m_kind >= 0 ? kinds[m_kind] : notChosen;
+    Label17.text = kindName();
     const QStringList extras = itemsOf(AlbumChoice::SpecialExtra);
     for (std::size_t i = 0; i < Check3.size(); ++i)
         Check3[i].text = extras[static_cast<qsizetype>(i)];
@@ -118,10 +118,14 @@ void AlbumPanels::showPanel() {
     Q_EMIT changed();
 }
 
+QString AlbumPanels::kindName() const {
+    return m_kind >= 0 ? itemsOf(AlbumChoice::Kind)[m_kind] : notChosen;
+}
+
 QString AlbumPanels::choiceSoFar() const {
     QStringList chosen;
     if (m_kind >= 0)
-        chosen += Label17.text;
+        chosen += kindName();
     for (const ComboCaption* list : {&Combo4Godel, &Combo4Cricha, &Combo4Niyar}) {
         if (list->taken())
             chosen += list->text;

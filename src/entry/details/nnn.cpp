@@ -237,7 +237,7 @@ void nnn::fillSizes() {
 void nnn::takeQuickSize(int index) {
     if (!within(Option1, index))
         return;
-    const QString size = Option1[static_cast<std::size_t>(index)].text.trimmed();
+    const QString size = m_quickSizes[static_cast<std::size_t>(index)].trimmed();
     checkOnly(Option1, index);
     CouponState& coupon = m_state.coupon;
     if (size == u"10/15" || size == u"20/30") {
@@ -263,7 +263,7 @@ void nnn::takePaperKind(int index) {
     if (!within(Option3, index))
         return;
     checkOnly(Option3, index);
-    m_state.shemot.maat = Option3[static_cast<std::size_t>(index)].text.trimmed();
+    m_state.shemot.maat = paperKind(index);
     goOnFrom(Step::Options);
 }
 

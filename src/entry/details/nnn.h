@@ -104,6 +104,7 @@ private:
     void rememberOrForget();
     void fillSizes();
     QString sizesPrompt() const;
+    QString paperKind(int index) const; // of Option3
     void takeQuickSize(int index);
     void takeListedSize(int row);
     void takePaperKind(int index);
@@ -137,6 +138,7 @@ private:
     AlbumPanels m_album;
     Step m_step = Step::Menu;
     Focus m_focus;
+    std::array<QString, 3> m_quickSizes; // of Option1; an empty one is not on offer
     QString VolumeSerial;
     bool m_termsHint = true; // not closed by the customer yet
     bool m_leaving = false;

@@ -100,8 +100,10 @@ void nnn::showStep() {
     Command2.visible = Command4.visible = !menu;
     Command7.visible = Command9.visible = Frame1.visible;
     LabelText4.visible = Text4.visible = m_step == Step::Details && m_state.MishloachHabaita;
-    for (CheckCaption& size : Option1)
-        size.visible = options && !size.text.isEmpty();
+    for (std::size_t i = 0; i < Option1.size(); ++i) {
+        Option1[i].text = m_quickSizes[i];
+        Option1[i].visible = options && !m_quickSizes[i].isEmpty();
+    }
     Command8.visible = options && (Option3[0].checked || Option3[1].checked);
     Command8.enabled = m_state.shemot.ppr != notChosen;
     Command6.visible = m_step == Step::Border && Picture16 >= 0;

@@ -42,8 +42,9 @@ void nnn::setTexts() {
         Image1[i].text = m_state.wording(text.hebrew, text.english);
         Image1[i].hint = m_state.wording(text.hebrewHint, text.englishHint);
     }
-    for (std::size_t i = 0; i < Option1.size(); ++i)
-        Option1[i].text = m_state.profile.QuickSizes[i];
+    m_quickSizes = m_state.profile.QuickSizes;
+    for (std::size_t i = 0; i < Option3.size(); ++i)
+        Option3[i].text = paperKind(static_cast<int>(i));
     setCaptions(m_state,
                 {
                     {LabelText2, u"שם פרטי ומשפחה", u"First and last name"},
@@ -62,8 +63,6 @@ void nnn::setTexts() {
                     {LabelSizes, u"גודל התמונות", u"Paper size"},
                     {LabelCombo1, u"גדלים נוספים", u"More sizes"},
                     {LabelKinds, u"סוג הנייר", u"Paper kind"},
-                    {Option3[0], u"מט", u"Matte"},
-                    {Option3[1], u"מבריק", u"Glossy"},
 
                     {Image13[0], u"ללא מסגרת", u"No border"},
                     {Image13[1], u"מסגרת B7", u"Border B7"},
@@ -104,6 +103,10 @@ void nnn::setTexts() {
 
 QString nnn::sizesPrompt() const {
     return m_state.wording(u"גדלים נוספים", u"More Sizes");
+}
+
+QString nnn::paperKind(int index) const {
+    return index == 0 ? m_state.wording(u"מט", u"Matte") : m_state.wording(u"מבריק", u"Glossy");
 }
 
 bool nnn::termsAgreed(const CheckCaption& box) {

@@ -29,11 +29,11 @@ void nnn::QuickCheck() {
 void nnn::CouponOrder(Coupon coupon) {
     m_state.coupon.SmallCount = coupon == Coupon::Small ? 220 : 350;
     m_state.coupon.LargeCount = coupon == Coupon::Small ? 3 : 5;
-    Option1[0].text = u"10/15"_s;
-    Option1[1].text = u"20/30"_s;
+    m_quickSizes[0] = u"10/15"_s;
+    m_quickSizes[1] = u"20/30"_s;
     if (termsAgreed(Check1))
         nameGiven();
-    Q_EMIT changed();
+    showStep();
 }
 
 bool nnn::nameGiven() {

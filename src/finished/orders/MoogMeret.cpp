@@ -32,6 +32,10 @@ constexpr struct {
     std::array<bool, 4> in; // Orders, Picked, Walking, Walked
 } shownBy[] = {
     {&MoogMeretControls::Picture3, {true, true, false, false}},
+    {&MoogMeretControls::hintPanel, {true, false, false, false}},
+    {&MoogMeretControls::walkPanel, {false, false, true, true}},
+    {&MoogMeretControls::waysPanel, {false, true, false, true}},
+    {&MoogMeretControls::endPanel, {false, false, false, true}},
     {&MoogMeretControls::Picture2, {false, true, false, false}},
     {&MoogMeretControls::Label4Shalav3, {false, true, false, false}},
     {&MoogMeretControls::Command4, {true, true, false, false}},
@@ -248,7 +252,7 @@ void MoogMeret::ShowFamilyCount() {
 // The FTP sender gets the list of files; the HTTP sender takes the whole folder and asks its server which files are
 // missing.
 void MoogMeret::sendAgain() {
-    if (!mayAct() || !Command4.visible)
+    if (!mayAct() || m_phase == Phase::Walked)
         return;
     List1.clear();
     List1.append(m_files.resendList());

@@ -17,6 +17,12 @@ struct Platform;
 struct MoogMeretControls : Controls {
     Caption Title{*this, u"Title"};
 
+    // Panels that only group controls and have no name.
+    Caption hintPanel; // what to do while no order is picked
+    Caption walkPanel; // the packages that are sent by mail
+    Caption waysPanel; // the preview and the ways to send, or the result of the walk
+    Caption endPanel;  // the result
+
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // step one: the orders
     Caption Label4Shalav1{*this, u"Label4Shalav1"};
     TextList Dir1{*this, u"Dir1"}; // folders below Dir1Path
@@ -142,7 +148,7 @@ public:
     // The state of the mail. Good: the server has taken the present package, after the walk all packages.
     enum class Answer { None, Sending, Good, Bad };
     Answer answer() const;
-    int packagesDone() const; // packages sent, or shown if no mail server is set up
+    int packagesDone() const; // packages sent; without a mail server, packages shown
     bool clockRuns() const { return Timer3.running(); }
 
     // The signal is Page::changed().
@@ -182,6 +188,7 @@ private:
     void pickPackage(int index);
     void selectPackage(int index);
     void sendPackage(int index);
+    QString packageText() const;
     void showWalk();
     void showOutcome();
     bool mailSetUp() const { return m_state.profile.mail.setUp(); }

@@ -69,10 +69,13 @@ void MoogMeret::showWhatIsMarked() {
                               u"The order travels in pieces: the pieces (prk) and the order sheet are marked."_s);
 }
 
+QString MoogMeret::packageText() const {
+    return m_state.wording(u"מנה %1 מתוך %2"_s, u"Package %1 of %2"_s).arg(List1.currentIndex() + 1).arg(List1.count());
+}
+
 void MoogMeret::showWalk() {
     Label13.text = QString::number(static_cast<int>(m_walk.minutes()));
-    Label4Mana.text =
-        m_state.wording(u"מנה %1 מתוך %2"_s, u"Package %1 of %2"_s).arg(List1.currentIndex() + 1).arg(List1.count());
+    Label4Mana.text = packageText();
     Label4Shem.text = List1.currentIndex() < 0 ? QString() : LeafName(List1.currentItem());
     Q_EMIT changed();
 }

@@ -26,7 +26,7 @@ int MoogMeret::packagesDone() const {
 }
 
 void MoogMeret::sendByMail() {
-    if (!mayAct() || !Command2.visible)
+    if (!mayAct())
         return;
     listPackages();
     if (List1.isEmpty())
@@ -136,7 +136,7 @@ void MoogMeret::sendPackage(int index) {
     Label4Doar.hint.clear();
     Q_EMIT changed();
     const DrivePath order = path.folder();
-    const QString letter = MailLetter(m_state, detailsOf(order), path.leaf(), Label4Mana.text);
+    const QString letter = MailLetter(m_state, detailsOf(order), path.leaf(), packageText());
     MailOutcome outcome;
     if (const auto file = m_platform.files.drives().toHost(path))
         outcome = m_platform.mail.send(m_state.profile.mail, {order.leaf(), letter, *file});

@@ -73,7 +73,7 @@ Cut Mod4split::SplitFile(const DrivePath& path, const QString& segmentText, Targ
     const auto source = openSource(*host, path.text());
     if (!source)
         return refuse(source.failure());
-    cut.folder = path.parent();
+    cut.folder = path.folder();
     if (target == Target::Meforakim) {
         cut.folder = cut.folder / meforakim;
         if (const auto made = m_files.makeFolder(cut.folder); !made)
@@ -128,7 +128,7 @@ Joined Mod4split::MergeFamily(const DrivePath& piecePath) const {
     if (!name)
         return refuse(fault(Failure::Kind::Unsupported, piecePath.text(),
                             u"no piece: the name is shorter than a name and \"_001_001.prk\""_s));
-    const DrivePath folder = piecePath.parent() / moorkavim;
+    const DrivePath folder = piecePath.folder() / moorkavim;
     // A family whose pieces were removed meanwhile must not leave an empty folder.
     if (m_files.fileExists(beside(piecePath, 1))) {
         if (const auto made = m_files.makeFolder(folder); !made)

@@ -51,7 +51,7 @@ DrivePath SpltForm::pickFile() {
     const QString prompt = wording(u"בחר תמונה אחת בלבד "_s, u"Choose one picture only "_s);
     const DrivePath path = m_platform.dialogs.pickFile(prompt, m_folder, prompt, Dialogs::Offer::EveryFile);
     if (!path.isEmpty())
-        m_folder = path.parent();
+        m_folder = path.folder();
     return path;
 }
 
@@ -209,7 +209,7 @@ void SpltForm::joinAll() {
         else if (!result.stopped)
             ++tally.done;
         if (!result.file.isEmpty())
-            where = result.file.parent();
+            where = result.file.folder();
         if (result.failure && result.failure->kind == Failure::Kind::NoSpace)
             break;
     }
@@ -239,7 +239,7 @@ void SpltForm::joinChosen() {
         total += wording(u" בשם רשומים %1 חלקים: יש לבדוק שהקובץ שלם."_s,
                          u" The name declares %1: check that the file is whole."_s)
                      .arg(result.declared);
-    end(result.pieces == result.declared ? Phase::Good : Phase::Partly, total, result.file.parent());
+    end(result.pieces == result.declared ? Phase::Good : Phase::Partly, total, result.file.folder());
 }
 
 Joined SpltForm::join(int index) {

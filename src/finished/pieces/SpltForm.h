@@ -62,7 +62,7 @@ public:
 
     // --- events ---
 
-    void Text2_Change(const QString& text) { Text2.text = text; }
+    void Text2_Change(const QString& text) { typeSize(text); }
     void Command2_Click() { chooseFilesToCut(); }
     void Command3_Click() { cutAll(); }
     void Command9_Click() { cutOne(); }
@@ -72,7 +72,7 @@ public:
     void Command6_Click() { showLengthOfChosen(); }
     void List4Bodedim_Click(int index) { chooseFamily(index); }
     void ListChalakim_Click(int index) { choosePiece(index); }
-    void Command15_Click() { m_stop = true; }
+    void Command15_Click() { stopWork(); }
     void Image3_Click() { goBack(); } // stops the work first
 
     // --- state ---
@@ -101,6 +101,8 @@ private:
     };
     enum class Fate { Listed, Joined, JoinedShort, Failed };
 
+    void typeSize(const QString& text) { Text2.text = text; }
+    void stopWork() { m_stop = true; }
     void chooseFilesToCut();
     void cutAll();
     void cutOne();

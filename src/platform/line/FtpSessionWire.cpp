@@ -318,7 +318,7 @@ Result<Poco::Net::ServerSocket> FtpSessionWire::openActive() {
     const Reply reply = four ? ask("PORT " + host.replace('.', ',') + ',' + QByteArray::number(port / 256) + ',' +
                                    QByteArray::number(port % 256))
                              : ask("EPRT |2|" + host + '|' + QByteArray::number(port) + '|');
-    if (reply.code < 200 || reply.code > 299)
+    if (!completed(reply.code))
         return refused(reply);
     return listener;
 }

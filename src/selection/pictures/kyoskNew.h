@@ -83,9 +83,9 @@ public:
     void Command28_Click() { closeBranches(); }
     void Command20_Click() { setDeepCompression(false); }
     void Command21_Click() { setDeepCompression(true); }
-    void Text1_Change(const QString& text) { Text1.text = text; }
-    void Text2_Change(const QString& text) { Text2.text = text; }
-    void Txt4Ml2_Change(const QString& text) { Txt4Ml2.text = text; }
+    void Text1_Change(const QString& text) { type(Text1, text); }
+    void Text2_Change(const QString& text) { type(Text2, text); }
+    void Txt4Ml2_Change(const QString& text) { type(Txt4Ml2, text); }
     void Combo1_Change(const QString& text) { typeDomain(text); }
     void Combo1_Click(int index) { chooseDomain(index); }
     void Command8_Click() { goOnWithAddress(); }
@@ -137,7 +137,7 @@ private:
     void repaint(const QString& path);
     HostPath hostOf(const DrivePath& path) const;
     DrivePath pictureToDraw(const QString& path) const;
-    void showLarge(const QString& path);
+    void showLarge(const DrivePath& path);
     void showGuide(Guide guide);
     void turnLargeView();
     void lookInLarge();
@@ -174,6 +174,7 @@ private:
     void showBranch(int branch);
     void closeBranches();
     void setDeepCompression(bool deep);
+    void type(Caption& box, const QString& text) { box.text = text; }
     void typeDomain(const QString& text);
     void chooseDomain(int index);
     void goOnWithAddress();
@@ -195,6 +196,8 @@ private:
     int m_openCell = -1;
     int m_rotation = 0;         // of the large view: 0, 90, 180, 270
     unsigned m_drawing = 0;     // the number of the latest redraw
+    DrivePath m_largePath;      // the picture of the large view, which Image4 turns
+    bool m_countShown = false;  // a folder was picked, and its pictures were counted
     bool m_picking = false;     // the file dialog is open
     bool m_promptStands = true; // Combo1 shows its prompt
     bool m_handedOver = false;

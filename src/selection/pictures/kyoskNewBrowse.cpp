@@ -40,7 +40,7 @@ void kyoskNew::setCellPixels(int pixels) {
             if (m_handedOver)
                 return;
             if (!Picture2.bitmap.isNull())
-                showLarge(Label2.text);
+                showLarge(m_largePath);
             drawCells();
         },
         Qt::QueuedConnection);
@@ -123,8 +123,10 @@ void kyoskNew::takeFolderOf(const DrivePath& picture) {
 }
 
 void kyoskNew::showPictureCount() {
-    Label34.text = QString::number(m_choice.folders().count());
-    pictureCount.text = m_state.wording(u"%1 תמונות", u"%1 pictures").arg(Label34.text);
+    m_countShown = true;
+    const QString count = QString::number(m_choice.folders().count());
+    Label34.text = count;
+    pictureCount.text = m_state.wording(u"%1 תמונות", u"%1 pictures").arg(count);
 }
 
 void kyoskNew::showFolderOffer() {
@@ -190,8 +192,8 @@ void kyoskNew::repaint(const QString& path) {
     Q_EMIT changed();
 }
 
-void kyoskNew::showLarge(const QString& path) {
-    const HostPath host = hostOf(DrivePath(path));
+void kyoskNew::showLarge(const DrivePath& path) {
+    const HostPath host = hostOf(path);
     const Result<PictureSize> size = readPictureSize(host);
     if (!size)
         return;
@@ -220,14 +222,14 @@ void kyoskNew::showLarge(const QString& path) {
 
 void kyoskNew::turnLargeView() {
     m_rotation = (m_rotation + 90) % 360;
-    showLarge(Label2.text);
+    showLarge(m_largePath);
     Q_EMIT changed();
 }
 
 void kyoskNew::lookInLarge() {
     if (Picture2.bitmap.isNull())
         return;
-    m_chain.load<Form3>().open(Label2.text);
+    m_chain.load<Form3>().open(m_largePath);
     m_chain.follow(pageId, Outcome::TurnedWanted);
 }
 

@@ -18,12 +18,13 @@ void kyoskNew::choosePicture(int cell) {
         return;
     if (plain()) {
         m_choice.choose(cell, {});
-        showLarge(path);
+        showLarge(DrivePath(path));
     } else {
         leaveEditor();
         takeIntoEditor(path);
         m_choice.choose(cell, m_state.edit.EditState);
     }
+    m_largePath = DrivePath(path);
     Label1.text = Label2.text = path;
     showChoice();
     if (plain())
@@ -54,8 +55,8 @@ tFrmNew& kyoskNew::editor() const {
     return *m_chain.find<tFrmNew>();
 }
 
-// A held zoom is let go and a dragged caption is packed before the next picture's fields replace these, so that the
-// print is what the customer saw.
+// A held zoom ends and a dragged caption is packed before the next picture's fields replace the present ones, so that
+// the print is what the customer saw.
 void kyoskNew::leaveEditor() {
     editor().stopHolds();
     editor().keepRecord();
@@ -122,7 +123,7 @@ void kyoskNew::storeSmallView() {
         return;
     const Bitmap preview = editor().takeSmallView();
     if (preview.isNull())
-        return; // what was stored last still holds
+        return; // the view stored last is still right
     const Result<void> stored = StoredSmallView::store(m_state, m_platform.files, m_state.edit.PicturePath, preview);
     if (!stored)
         m_platform.dialogs.message(stored.failure().message);

@@ -14,7 +14,7 @@ void kyoskNew::setTexts() {
     showGuide(m_guide);
     if (m_grade != PrintGrade::Unmarked)
         Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
-    if (!Label34.text.isEmpty())
+    if (m_countShown)
         showPictureCount();
     showChoice();
 }

@@ -93,7 +93,7 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
 }
 
 void HttpSender::post(const QString& path) {
-    const DrivePath folder = DrivePath(path).parent();
+    const DrivePath folder = DrivePath(path).folder();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     m_events.reached(SendingMoment::Answered);
@@ -156,7 +156,7 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     m_state.transfer.ShemTikiya = name;
     m_events.reached(SendingMoment::Answered);
     if (lists.List4Kvazim.isEmpty() || !OrderFolder(order).isChosen() ||
-        DrivePath(lists.List4Kvazim.item(0)).parent().leaf() != name)
+        DrivePath(lists.List4Kvazim.item(0)).folder().leaf() != name)
         return ServerVerdict::OtherFolder;
     HttpFetchFileListN(listNumber);
     if (m_stop.left)

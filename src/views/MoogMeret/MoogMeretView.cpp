@@ -35,13 +35,14 @@ QWidget* MoogMeretView::makeOrders() {
 
 // Stands in place of the files until an order is picked.
 QWidget* MoogMeretView::makeHint() {
-    m_hint =
+    QWidget* hint =
         inBox(inColumn(Space::Normal, {Item::room(),
                                        {sign(u"pictures"_s, IconSize::Page, Theme::Colour::Edge), 0, Qt::AlignCenter},
                                        centred(label(c.Label4Rek, "large")),
                                        centred(label(c.Label4Bhar, "large")),
                                        Item::room()}));
-    return m_hint;
+    follow(hint, c.hintPanel);
+    return hint;
 }
 
 QWidget* MoogMeretView::makeFiles() {
@@ -64,6 +65,7 @@ QWidget* MoogMeretView::makeFiles() {
 
 QWidget* MoogMeretView::makeWalk() {
     m_gauge = new Gauge(theme(), this);
+    follow(m_gauge, c.Label4Mana);
     m_parts = centred(words("body"));
     m_minutes = button(c.Label13, Role::Plain, &MoogMeret::Label13_Click, u"clock"_s);
     const Card answer = makeCard("card", Pad::Normal);
@@ -73,15 +75,16 @@ QWidget* MoogMeretView::makeWalk() {
         inRow(Space::Normal, {{m_answerSign, 0, Qt::AlignTop},
                               {inColumn(Space::Tight, {label(c.Label4Sof, "strong"), label(c.Label4Doar)}), 1}}));
     m_packages = list(c.List1, &MoogMeret::List1_Click, [](const QString& path) { return fromLeft(LeafName(path)); });
-    m_walk = inBox(inColumn(Space::Small, {{m_gauge, 3, Qt::AlignCenter},
-                                           centred(label(c.Label4Mana, "large")),
-                                           centred(label(c.Label4Shem, "muted")),
-                                           m_parts,
-                                           {m_minutes, 0, Qt::AlignCenter},
-                                           m_answer,
-                                           {m_packages, 4},
-                                           centred(label(c.Label24, "muted"))}));
-    return m_walk;
+    QWidget* walk = inBox(inColumn(Space::Small, {{m_gauge, 3, Qt::AlignCenter},
+                                                  centred(label(c.Label4Mana, "large")),
+                                                  centred(label(c.Label4Shem, "muted")),
+                                                  m_parts,
+                                                  {m_minutes, 0, Qt::AlignCenter},
+                                                  m_answer,
+                                                  {m_packages, 4},
+                                                  centred(label(c.Label24, "muted"))}));
+    follow(walk, c.walkPanel);
+    return walk;
 }
 
 QWidget* MoogMeretView::makeWays() {
@@ -90,8 +93,10 @@ QWidget* MoogMeretView::makeWays() {
     connect(m_preview, &ScrolledPicture::movedAcross, this, toPage(&MoogMeret::HScroll1_Change));
     connect(m_preview, &ScrolledPicture::movedDown, this, toPage(&MoogMeret::VScroll1_Change));
     bind(u"Picture1"_s, m_preview, [this] { return u"%1 x %2"_s.arg(c.Picture1.width()).arg(c.Picture1.height()); });
+    follow(m_preview, c.Picture2);
     m_end = new Gauge(theme(), this);
-    m_ways =
+    follow(m_end, c.endPanel);
+    QWidget* ways =
         inBox(inColumn(Space::Normal, {m_preview,
                                        Item::room(),
                                        {m_end, 0, Qt::AlignCenter},
@@ -99,8 +104,9 @@ QWidget* MoogMeretView::makeWays() {
                                        label(c.Label4Shalav3, "strong"),
                                        button(c.Command4, Role::Main, &MoogMeret::Command4_Click, u"send"_s),
                                        button(c.Command2, Role::Secondary, &MoogMeret::Command2_Click, u"mail"_s)}));
-    m_ways->setFixedWidth(m_preview->width());
-    return m_ways;
+    ways->setFixedWidth(m_preview->width());
+    follow(ways, c.waysPanel);
+    return ways;
 }
 
 void MoogMeretView::makeBars() {
@@ -117,22 +123,13 @@ QWidget* MoogMeretView::firstFocus() const {
 }
 
 void MoogMeretView::render() {
-    using Phase = MoogMeret::Phase;
-    const Phase phase = m_page.phase();
-    if (phase == Phase::Leaving)
+    if (m_page.phase() == MoogMeret::Phase::Leaving)
         return;
-    const bool picked = phase == Phase::Picked;
-    const bool walk = phase == Phase::Walking || phase == Phase::Walked;
     frame().setTitle(c.Title.text, c.Label23.text);
-    m_hint->setVisible(phase == Phase::Orders);
-    m_walk->setVisible(walk);
-    m_ways->setVisible(picked || phase == Phase::Walked);
-    m_preview->setVisible(picked);
-    m_end->setVisible(phase == Phase::Walked);
     renderOrders();
-    if (picked)
+    if (c.Picture2.visible)
         renderFiles();
-    if (walk)
+    if (c.walkPanel.visible)
         renderWalk();
 }
 
@@ -164,25 +161,23 @@ void MoogMeretView::renderFiles() {
 }
 
 void MoogMeretView::renderWalk() {
-    const bool walking = m_page.phase() == MoogMeret::Phase::Walking;
     const MoogMeret::Answer answer = m_page.answer();
     const int count = c.List1.count();
     const auto of = [count](int done) { return u"%1 / %2"_s.arg(done).arg(count); };
-    m_gauge->setVisible(walking);
     m_gauge->show(m_page.walk().share(c.List1.currentIndex()), of(c.List1.currentIndex() + 1), c.Label3.text);
     const int done = m_page.packagesDone();
     if (answer == MoogMeret::Answer::Bad || answer == MoogMeret::Answer::Good)
         m_end->showSign(answer == MoogMeret::Answer::Bad ? Gauge::Mood::Bad : Gauge::Mood::Good);
     else
         m_end->show(count == 0 ? 0 : double(done) / count, of(done), c.Label3.text);
-    m_parts->setVisible(walking);
+    m_parts->setVisible(c.Label4Mana.visible);
     m_parts->setText(
         isolated(c.Label9.text + u'\n' + c.Label2.text + u' ' + QString::number(count) + u' ' + c.Label3.text));
     m_minutes->setText(c.Label4Dakot.text + u' ' + c.Label13.text);
     speak(m_minutes, m_minutes->text());
     renderAnswer();
 
-    m_packages->setVisible(!walking);
+    m_packages->setVisible(c.endPanel.visible);
     m_packages->setEnabled(answer != MoogMeret::Answer::Sending);
     m_packages->setAccessibleName(c.Label3.text);
     const std::pair<QString, QColor> icons[] = {{u"document"_s, Theme::Colour::Muted}, // by PackageWalk::Fate

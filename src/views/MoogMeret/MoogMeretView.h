@@ -30,12 +30,9 @@ private:
     void renderAnswer();
 
     QListWidget* m_orders = nullptr;
-    QWidget* m_hint = nullptr;
     QListWidget* m_fileList = nullptr;
     QLabel* m_counts = nullptr;
-    QWidget* m_ways = nullptr;
     ScrolledPicture* m_preview = nullptr;
-    QWidget* m_walk = nullptr;
     Gauge* m_gauge = nullptr;
     Gauge* m_end = nullptr;
     QLabel* m_parts = nullptr;

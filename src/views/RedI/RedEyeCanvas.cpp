@@ -224,7 +224,7 @@ void RedEyeSteps::paintEvent(QPaintEvent*) {
         painter.setFont(m_theme.font(Theme::Type::Strong));
         painter.setPen(present ? QColor(Qt::white) : done ? Theme::Colour::PrimaryDark : Theme::Colour::Muted);
         painter.drawText(mark, Qt::AlignCenter, QString::number(i + 1));
-        const double beside = disc + m_theme.px(8);
+        const double beside = disc + m_theme.size(Space::Small);
         const QRectF words(leftwards ? left + m_theme.px(6) : left + beside, 0, cell - beside - m_theme.px(6),
                            height());
         painter.setFont(m_theme.font(present ? Theme::Type::Strong : Theme::Type::Body));

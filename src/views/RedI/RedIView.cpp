@@ -170,7 +170,7 @@ void RedIView::makeOverPicture() {
 
 void RedIView::makeMenu() {
     m_menu = new Overlay(theme(), this);
-    m_menu->column()->addWidget(label(u"CommandMenuTitle"_s, c.CommandMenu, "title"));
+    m_menu->column()->addWidget(echo(c.CommandMenu, "title"));
     const struct {
         const Caption& caption;
         void (RedI::*press)();

@@ -57,7 +57,7 @@ ChoiceCards* nnnView::Album::cards(const ComboCaption& choice, int columns, cons
     const auto make = [this, drawings, size](int row) {
         return makeAlbumCard(m_theme, &m_view, drawings[std::min<qsizetype>(row, drawings.size() - 1)], size);
     };
-    return m_view.choiceCards(m_view.nameOf(choice), choice.rows, choice, columns, make, toAlbum(taken));
+    return m_view.choiceCards(choice.rows, choice, columns, make, toAlbum(taken));
 }
 
 QWidget* nnnView::Album::makePhotographer() {

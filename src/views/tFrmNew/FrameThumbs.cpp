@@ -56,7 +56,7 @@ public:
                                                                              : Theme::Colour::Line,
                                      worn ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
                                      worn ? m_theme.thick() : m_theme.px(1), m_theme.px(8));
-        const int inset = m_theme.px(4);
+        const int inset = m_theme.size(Space::Tight);
         const QImage& frame = clear(index.row());
         const QRectF paper =
             fitted(card.adjusted(inset, inset, -inset, -inset), frame.isNull() ? QSizeF(3, 2) : QSizeF(frame.size()));

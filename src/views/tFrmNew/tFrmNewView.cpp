@@ -130,7 +130,7 @@ QLayout* tFrmNewView::makeTurns() {
         m_page.Image15_MouseMove();
     });
     m_turn->installEventFilter(this);
-    // A finger does not hover: this button opens the panel without a turn.
+    // A finger does not hover, so this button opens the panel without a turn.
     m_fineTurn = new ToolButton(theme(), u"turn-fine"_s, wide, this);
     bind(m_fineTurn, c.Frame4Opener);
     connect(m_fineTurn, &QPushButton::clicked, this,
@@ -226,7 +226,7 @@ void tFrmNewView::makeBars() {
 // --- what the page says ---
 
 void tFrmNewView::listenToPictures() {
-    auto* pictures = static_cast<kyoskNew*>(m_chain.find(PageId::kyoskNew));
+    auto* pictures = m_chain.find<kyoskNew>();
     if (pictures == m_pictures)
         return;
     m_pictures = pictures;

@@ -198,8 +198,7 @@ void PageView::keyPressEvent(QKeyEvent* event) {
         QWidget::keyPressEvent(event);
 }
 
-QPushButton* PageView::button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
-                              const QString& icon) {
+QPushButton* PageView::button(const Caption& caption, Role role, std::function<void()> clicked, const QString& icon) {
     auto* made = new QPushButton(this);
     static constexpr const char* roles[] = {"main", "secondary", "plain", "quiet", "danger"};
     setRole(made, roles[static_cast<int>(role)]);
@@ -210,13 +209,13 @@ QPushButton* PageView::button(const QString& name, const Caption& caption, Role 
                 : role == Role::Danger ? Theme::Colour::Danger
                                        : Theme::Colour::Ink);
     connect(made, &QPushButton::clicked, this, [clicked = std::move(clicked)] { clicked(); });
-    bind(name, made, caption);
+    bind(made, caption);
     return made;
 }
 
-QLabel* PageView::label(const QString& name, const Caption& caption, const char* type) {
+QLabel* PageView::label(const Caption& caption, const char* type) {
     QLabel* made = makeLabel(this, type);
-    bind(name, made, caption);
+    bind(made, caption);
     return made;
 }
 
@@ -262,48 +261,48 @@ void PageView::bindName(QWidget* widget, const Caption& caption) {
     bind(nameOf(caption), widget, [&caption] { return caption.text; });
 }
 
-QLineEdit* PageView::field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited) {
+QLineEdit* PageView::field(const Caption& caption, std::function<void(const QString&)> edited) {
     auto* made = new QLineEdit(this);
     made->setProperty("ownRing", true); // its border tells
     connect(made, &QLineEdit::textEdited, this, [edited = std::move(edited)](const QString& text) { edited(text); });
-    bind(name, made, caption);
+    bind(made, caption);
     return made;
 }
 
-QCheckBox* PageView::checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked) {
+QCheckBox* PageView::checkBox(const CheckCaption& caption, std::function<void(bool)> clicked) {
     auto* made = new QCheckBox(this);
     made->setFocusPolicy(Qt::TabFocus);
     connect(made, &QCheckBox::clicked, this, [this, clicked = std::move(clicked)](bool on) {
         clicked(on);
         schedule();
     });
-    bind(name, made, caption);
+    bind(made, caption);
     return made;
 }
 
-QComboBox* PageView::comboBox(const QString& name, const TextList& list, const Caption& caption,
-                              std::function<void(int)> activated) {
+QComboBox* PageView::comboBox(const TextList& list, const Caption& caption, std::function<void(int)> activated) {
     auto* made = new QComboBox(this);
     made->setProperty("ownRing", true);
     connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
-    bind(name, made, caption);
+    bind(made, caption);
     m_controls.back().list = &list;
     return made;
 }
 
-ChoiceCards* PageView::choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+ChoiceCards* PageView::choiceCards(const TextList& list, const Caption& caption, int columns,
                                    std::function<CardButton*(int)> maker, std::function<void(int)> activated) {
     auto* made = new ChoiceCards(m_theme, this, columns, std::move(maker));
     connect(made, &ChoiceCards::activated, this, [this, activated = std::move(activated)](int row) {
         activated(row);
-        schedule(); // the press has turned the mark over by itself; the page's word counts
+        schedule(); // the press has turned the mark over by itself, which the page may not accept
     });
-    bind(name, made, caption);
+    bind(made, caption);
     m_controls.back().list = &list;
     return made;
 }
 
-void PageView::bind(const QString& name, QWidget* widget, const Caption& caption) {
+void PageView::bind(QWidget* widget, const Caption& caption) {
+    const QString name = nameOf(caption);
     widget->setObjectName(name);
     m_controls.push_back({name, widget, &caption, nullptr, {}});
 }
@@ -312,14 +311,13 @@ void PageView::follow(QWidget* widget, const Caption& caption) {
     m_controls.push_back({{}, widget, &caption, nullptr, {}});
 }
 
-void PageView::bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
-                          std::function<void()> clicked) {
+void PageView::bindChoice(QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked) {
     button->setCheckable(true);
     connect(button, &QAbstractButton::clicked, this, [this, clicked = std::move(clicked)] {
         clicked();
-        schedule(); // the press has turned the mark over by itself; the page's word counts
+        schedule();
     });
-    bind(name, button, caption);
+    bind(button, caption);
 }
 
 void PageView::bind(const QString& name, QWidget* widget, std::function<QString()> text) {

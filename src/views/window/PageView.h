@@ -42,7 +42,7 @@ public:
 
     const Page& page() const { return m_page; }
 
-    // What a person reads where the page's text stands.
+    // What a person reads in place of the page's text.
     using Reading = std::function<QString(const QString&)>;
     // One control of the page, seen or not.
     struct Control {
@@ -57,13 +57,13 @@ public:
 
     // Renders now if something has changed since the last time.
     void renderNow();
-    // The page is gone or about to go: nothing of it is read from here on.
+    // The page is gone or about to go, and is not read any more.
     void detach();
     bool isDetached() const { return m_detached; }
-    // A panel is docked at the bottom of the window, as high as it wishes, over the view of the page shown before it,
-    // which stays in sight and answers wherever it is not covered. A panel shows its content alone: no header, no bars.
+    // A panel is docked at the bottom of the window over the view of the page shown before it, which stays visible and
+    // active where it is not covered. A panel shows its content alone, without header and bars.
     virtual bool isPanel() const { return false; }
-    // So many pixels of this view's lower part lie behind a panel; 0 when the panel has gone.
+    // pixels: height of this view's lower part that is behind a panel; 0 without one.
     virtual void setCoveredHeight(int) {}
     // Esc on the page itself.
     virtual void escape() {}
@@ -83,36 +83,20 @@ protected:
     PageFrame& frame() const { return *m_frame; }
     void keyPressEvent(QKeyEvent* event) override;
 
-    // Makers of bound controls. The parent comes with the layout that they are added to. A control that carries its own
-    // name needs no other.
-    QPushButton* button(const QString& name, const Caption& caption, Role role, std::function<void()> clicked,
-                        const QString& icon = {});
-    QPushButton* button(const Caption& caption, Role role, std::function<void()> clicked, const QString& icon = {}) {
-        return button(nameOf(caption), caption, role, std::move(clicked), icon);
-    }
-    QLabel* label(const QString& name, const Caption& caption, const char* type = "body");
-    QLabel* label(const Caption& caption, const char* type = "body") { return label(nameOf(caption), caption, type); }
+    // Makers of bound controls. Each takes the name of its caption, and its parent from the layout that it is added to.
+    QPushButton* button(const Caption& caption, Role role, std::function<void()> clicked, const QString& icon = {});
+    QLabel* label(const Caption& caption, const char* type = "body");
     QLabel* label(const Caption& caption, const char* type, Reading reading);
-    // Says the caption at a second place, without its name.
+    // Shows the caption at a second place, without its name.
     QLabel* echo(const Caption& caption, const char* type = "body");
     // A label that is never broken into lines.
     QLabel* lineLabel(const Caption& caption, const char* type = "body");
-    QLineEdit* field(const QString& name, const Caption& caption, std::function<void(const QString&)> edited);
-    QLineEdit* field(const Caption& caption, std::function<void(const QString&)> edited) {
-        return field(nameOf(caption), caption, std::move(edited));
-    }
-    QCheckBox* checkBox(const QString& name, const CheckCaption& caption, std::function<void(bool)> clicked);
-    QCheckBox* checkBox(const CheckCaption& caption, std::function<void(bool)> clicked) {
-        return checkBox(nameOf(caption), caption, std::move(clicked));
-    }
+    QLineEdit* field(const Caption& caption, std::function<void(const QString&)> edited);
+    QCheckBox* checkBox(const CheckCaption& caption, std::function<void(bool)> clicked);
     // Rows from the list; what the box says from the caption, which may be a text that is no row.
-    QComboBox* comboBox(const QString& name, const TextList& list, const Caption& caption,
-                        std::function<void(int)> activated);
-    QComboBox* comboBox(const TextList& list, const Caption& caption, std::function<void(int)> activated) {
-        return comboBox(nameOf(caption), list, caption, std::move(activated));
-    }
+    QComboBox* comboBox(const TextList& list, const Caption& caption, std::function<void(int)> activated);
     // The same as large cards, of which all rows are in sight.
-    ChoiceCards* choiceCards(const QString& name, const TextList& list, const Caption& caption, int columns,
+    ChoiceCards* choiceCards(const TextList& list, const Caption& caption, int columns,
                              std::function<CardButton*(int)> maker, std::function<void(int)> activated);
 
     // A list to look at, and one whose rows answer to a touch and to Enter alike.
@@ -122,14 +106,9 @@ protected:
     // The widget shows where the caption does, and keeps no name.
     void follow(QWidget* widget, const Caption& caption);
     // Binds a widget of the view's own making.
-    void bind(const QString& name, QWidget* widget, const Caption& caption);
-    void bind(QWidget* widget, const Caption& caption) { bind(nameOf(caption), widget, caption); }
+    void bind(QWidget* widget, const Caption& caption);
     // A button of the view's own making that can be chosen.
-    void bindChoice(const QString& name, QAbstractButton* button, const CheckCaption& caption,
-                    std::function<void()> clicked);
-    void bindChoice(QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked) {
-        bindChoice(nameOf(caption), button, caption, std::move(clicked));
-    }
+    void bindChoice(QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked);
     void bind(const QString& name, QWidget* widget, std::function<QString()> text);
     // The widget has the control's name; the view itself renders what it says.
     void bindName(QWidget* widget, const Caption& caption);
@@ -175,21 +154,13 @@ protected:
 
     // A button that calls the page's handler, for one of an array with its index.
     using Base::button;
-    QPushButton* button(const QString& name, const Caption& caption, PageView::Role role, void (P::*clicked)(),
-                        const QString& icon = {}) {
-        return Base::button(name, caption, role, toPage(clicked), icon);
-    }
-    QPushButton* button(const QString& name, const Caption& caption, PageView::Role role, void (P::*clicked)(int),
-                        int index, const QString& icon = {}) {
-        return Base::button(
-            name, caption, role, [&page = m_page, clicked, index] { (page.*clicked)(index); }, icon);
-    }
     QPushButton* button(const Caption& caption, PageView::Role role, void (P::*clicked)(), const QString& icon = {}) {
-        return button(this->nameOf(caption), caption, role, clicked, icon);
+        return Base::button(caption, role, toPage(clicked), icon);
     }
     QPushButton* button(const Caption& caption, PageView::Role role, void (P::*clicked)(int), int index,
                         const QString& icon = {}) {
-        return button(this->nameOf(caption), caption, role, clicked, index, icon);
+        return Base::button(
+            caption, role, [&page = m_page, clicked, index] { (page.*clicked)(index); }, icon);
     }
     using Base::list;
     QListWidget* list(const TextList& rows, void (P::*picked)(int), PageView::Reading reading = {}) {

@@ -56,7 +56,7 @@ public:
                                  : index.data(BrokenRole).toBool() ? u"warning"_s
                                                                    : u"picture"_s;
             drawIcon(*painter, box.center(),
-                     m_theme.icon(icon, m_theme.px(folder ? 68 : 44),
+                     m_theme.icon(icon, folder ? m_theme.px(68) : m_theme.size(IconSize::Box),
                                   folder ? Theme::Colour::Primary : Theme::Colour::Muted));
         }
         painter->setFont(m_theme.font(Theme::Type::Small));
