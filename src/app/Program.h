@@ -23,11 +23,11 @@ struct ProgramOptions {
     QSize windowSize;                   // an empty one leaves the size to the screen
     bool fullScreen = false;
     bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
-    Internet* internet = nullptr; // in place of the machine's own line
+    Internet* internet = nullptr; // replaces the machine's own line
 };
 
 // One run of the program: the session, the machine, the chain of pages and the window. Needs an Application (in
-// views/). A program that presses the controls in place of a person uses this class too.
+// views/). The scenario player runs the program through this class too.
 class Program {
 public:
     explicit Program(ProgramOptions options);
@@ -40,7 +40,7 @@ public:
     // The end of the page chain quits the application.
     Result<void> start();
 
-    // After InUse: the other run was asked to come to the front, and its display allows that.
+    // True after InUse when the other run was asked to come to the front and its display allows it.
     bool otherCameForward() const { return m_otherCameForward; }
 
     // Valid once start() has succeeded.

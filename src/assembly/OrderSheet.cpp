@@ -37,7 +37,8 @@ constexpr PictureSize largestSheet = {1100, 1300};
 // Pixels of a 96 dpi screen: 12 and 8 points.
 constexpr int lineFontPixels = 16;
 constexpr int captionFontPixels = 11;
-// From line to line, whatever the font would take: the seventeen lines of an album must end above its pictures.
+// Distance of the lines in pixels, independent of the font, so that the seventeen lines of an album end above its
+// pictures.
 constexpr int linePitch = 20;
 constexpr QPoint textStart(10, 10);
 
@@ -47,7 +48,7 @@ QFont sheetFont(int pixels) {
     return font;
 }
 
-// The lines run as the box's text output has it: from the left, the words of a Hebrew phrase in their own order.
+// The lines run from the left; the words of a Hebrew phrase keep their own order.
 void drawTextLine(QPainter& painter, int x, int top, const QString& text) {
     painter.setLayoutDirection(Qt::LeftToRight);
     painter.drawText(QPoint(x, top + painter.fontMetrics().ascent()), text);
@@ -58,8 +59,8 @@ struct DeliveryPlace {
     const char16_t* line;
 };
 
-// Where the prints are fetched, by the way in which the order came; the two kinds of order know different ways. The
-// places are those of the lab's branches.
+// The place where the prints are fetched, by how the order started; the two kinds of order start in different ways. The
+// places are the lab's branches.
 constexpr std::array<DeliveryPlace, 3> plainPlaces = {{
     {u"KIN", u"קבלת תמונות בקניון"},
     {u"LOB", u"קבלת תמונות בלובי"},
@@ -146,7 +147,7 @@ QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
         plainTopLine(state, now),
         u"  ShemZalam...."_s + album.ShemZalam + u"        TelZalam....."_s + album.TelZalam + u"      "_s +
             state.shemot.n4,
-        // The address stands on the line of the event.
+        // The address is on the line of the event.
         u"  ShemErooa...."_s + album.ShemErooa + u"    "_s + state.shemot.n3 + u"      "_s,
         u"  MailZalam...."_s + album.MailZalam,
         u"  Total pictures..."_s + QString::number(state.shemot.TotalPics),

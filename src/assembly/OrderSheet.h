@@ -39,7 +39,7 @@ struct SheetCell {
 
 inline constexpr int sheetCellSize = 80;
 
-// A picture as it lies on the sheet, always in landscape: 80 pixels wide, a portrait or square one turned a quarter
+// A picture as the sheet shows it, always in landscape: 80 pixels wide, a portrait or square one turned a quarter
 // clockwise.
 Result<Bitmap> sheetThumbnail(const std::filesystem::path& source);
 
@@ -49,9 +49,9 @@ public:
 
     void drawLines(const QStringList& lines);
 
-    // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, cells beyond them left out and
-    // what falls below the box clipped. Pictures are read on the machine's cores. after(i) runs on the calling thread
-    // behind each cell and whenever it waits; when it answers false the drawing ends there.
+    // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, without the cells beyond them
+    // and clipped at the bottom of the box. Pictures are read on several threads. after(i) runs on the calling thread
+    // after each cell and while it waits; false ends the drawing.
     void drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after);
 
     // How many cells the grid holds.

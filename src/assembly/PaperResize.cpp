@@ -12,7 +12,7 @@ using namespace Qt::StringLiterals;
 PictureSize paperPictureSize(PictureSize source, PaperSize paper) {
     const double ratio = static_cast<double>(source.height) / std::max(source.width, 1);
     const int width = (ratio >= 1 ? paper.shortSide : paper.longSide) * pixelsPerCentimetre;
-    // The product first: it is exact, so that a height of one half is seen as one.
+    // The product is computed first since it is exact, so that a height that ends in one half is recognised.
     const double height = static_cast<double>(width) * source.height / std::max(source.width, 1);
     const long long rounded = RoundHalfEven(height);
     if (width > source.width || rounded > source.height)

@@ -27,7 +27,7 @@ void PrintPacker::beginStep() {
 PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Result<QByteArray>()>& picture) {
     if (const Result<void> gone = m_files.fileExists(m_scratch) ? m_files.removeFile(m_scratch) : Result<void>();
         !gone) {
-        static_cast<void>(picture()); // one that is made ahead must not wait for the next step
+        static_cast<void>(picture()); // a print that was made ahead must not come in the next step
         return {false, gone.failure()};
     }
     const Result<QByteArray> made = picture();

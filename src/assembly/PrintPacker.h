@@ -25,7 +25,7 @@ public:
 
     const OrderFolder& folder() const { return m_folder; }
 
-    // Begins a step: sees to it that the folder is there. A failure comes out of pack().
+    // Begins a step and makes the folder if it is missing; pack() returns a failure of that.
     void beginStep();
 
     struct Line {
@@ -35,18 +35,18 @@ public:
     };
     struct Outcome {
         bool packed = false;
-        // Set where a file of the order could not be written: a picture that can't be read is its own fault.
+        // Set when a file of the order could not be written, not for a picture that can't be read.
         std::optional<Failure> writeFailure;
     };
     // Removes the scratch picture of the step before, makes a new one by picture() and writes its print file. If
     // picture() fails there is no scratch picture, so that no picture is printed as the one before it.
     Outcome pack(const Line& line, const std::function<Result<QByteArray>()>& picture);
 
-    // Takes the scratch picture away.
+    // Removes the scratch picture.
     void removeScratch() const;
     const DrivePath& scratch() const { return m_scratch; }
 
-    // What a manifest would tell of the step in work: length, code, running number, name.
+    // The present step as a line of a manifest: length, code, running number, name.
     const QString& manifestLine() const { return m_manifestLine; }
 
 private:

@@ -12,9 +12,9 @@
 namespace lumora {
 
 // Pure work done ahead on the machine's other cores while one thread takes the results in order. Work is a function
-// that touches nothing shared: what it needs goes in by value, what it makes comes out as the result. At most depth()
-// pieces are under way or wait to be taken, so that memory does not grow with the length of the list. The destructor
-// waits for what is under way.
+// without shared state: its inputs are captured by value and its result is returned. At most depth() pieces are under
+// way or wait to be taken, so that memory does not grow with the length of the list. The destructor waits for what is
+// under way.
 template <class T>
 class WorkAhead {
 public:
@@ -28,8 +28,8 @@ public:
     // Two pieces keep two cores busy and hold two pictures; more would cost memory and bring no time.
     static int depth() { return static_cast<int>(std::clamp(std::thread::hardware_concurrency(), 1U, 2U)); }
 
-    // The result of the next item, in order; calls whileWaiting again and again until it is there. Where waiting has
-    // let the world change so that no result is wanted any more, the caller just drops it.
+    // The result of the next item, in order; calls whileWaiting again and again until it is there. The caller may drop
+    // a result that it no longer needs.
     template <class Waiting>
     T take(Waiting whileWaiting) {
         refill();

@@ -7,7 +7,7 @@ class Ticker;
 // The held button of a page. Its ticker runs until the button is let go.
 class HeldButton {
 public:
-    // Lets go of the button that was held before.
+    // Ends the hold of the button that was held before.
     void press(Ticker& ticker);
     void release();
     bool isHeld() const { return m_ticker != nullptr; }

@@ -11,10 +11,9 @@ class Files;
 class OrderFolder;
 struct OrderLog;
 
-// The prints of an order, counted in three places. A print that travels in pieces counts when its whole family is
-// there.
+// The prints of an order, counted in three places. A print in pieces counts when all its pieces are there.
 struct OrderCompleteness {
-    // What the log names: its lines with a usable name, less the pictures that failed. None where there is no log.
+    // Prints that the log names: its lines with a usable name, less the pictures that failed. No value without a log.
     std::optional<int> named;
     int present = 0; // in the folder
     int marked = 0;  // among what is to be sent
@@ -23,7 +22,7 @@ struct OrderCompleteness {
         None,    // no print would be sent
         Fewer,   // not all that the log names
         Whole,   // all of them
-        Unknown, // without a log nobody knows how many there should be
+        Unknown, // there is no log, so the number of prints is not known
     };
     Verdict verdict() const;
 
@@ -32,9 +31,9 @@ struct OrderCompleteness {
     static OrderCompleteness read(const Files& files, const OrderFolder& folder, const QStringList& marked);
 };
 
-// The prints among these leaf names, each once: print files, and families of their pieces that are whole, which are
-// those with the numbers 1 to n without a gap and n at least the declared total less one. A source of an exact multiple
-// of the segment declares one piece more than it has.
+// The prints among these leaf names, each once: print files, and complete families of pieces, numbered 1 to n without a
+// gap, with n at least the declared total less one. A file of an exact multiple of the segment declares one piece more
+// than it has.
 QStringList PrintsAmong(const QStringList& names);
 
 } // namespace lumora

@@ -12,20 +12,19 @@ namespace lumora {
 class Files;
 class OrderFolder;
 
-// How far an order has come, kept in the hidden file .order of its folder, so that it can go on behind the end of the
-// program. It never travels. docs/formats.md has the table.
+// How far an order has come, kept in the hidden file .order of its folder, so that it can be continued after the
+// program has ended. The file is never sent. docs/formats.md has the table.
 struct OrderState {
     enum class Phase {
         Preparing, // prints are being made; the basket and the choices are kept with it
-        Prepared,  // whole on the disk, nothing of it sent
+        Prepared,  // complete on the disk, nothing is sent
         Sending,   // its folder on the server was entered; a part may lie there
-        Arrived,   // proven to lie on the server
+        Arrived,   // proven to be on the server
         Reported,  // arrived, and the lab was told or needs no telling
     };
-    // By what the order leaves. A local station keeps it; one that went by mail is not known to the servers.
+    // The way by which the order is sent. A local station keeps it; the servers do not know an order that went by mail.
     enum class Way { Ftp, Http, Station, Mail };
-    // Report and done call. Begun is stored before the request goes out: whoever finds it can't know whether the lab
-    // has heard.
+    // Report and done call. Begun is stored before the request is sent, so it leaves open whether the lab has got it.
     enum class Report { NotYet, Begun, Done };
 
     Phase phase = Phase::Preparing;

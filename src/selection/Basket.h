@@ -34,10 +34,10 @@ public:
     void replaceAt(int index, const QString& line);
     void removeAt(int index);
 
-    // The copies of all lines. They are summed wide and held at what a 16-bit field takes.
+    // The copies of all lines. The sum is limited to 16 bits.
     int SumCopies() const;
 
-    // Drops each line that equals an earlier one but for its copies, so that the copies counted first stand.
+    // Removes each line that differs from an earlier one in its copies at most; the earlier copies stay.
     void removeDuplicates();
 
 private:
@@ -48,13 +48,14 @@ private:
     LineForm m_form = LineForm::Short;
     TextList m_lines;
     long long m_copies = 0;
-    // A number for each line, rising through the list: a path leads to its line also when lines before it were removed.
+    // A number for each line, ascending through the list, so that a path finds its line after earlier lines were
+    // removed.
     std::vector<unsigned> m_ids;
     unsigned m_nextId = 0;
     mutable QHash<QString, unsigned> m_byPath; // the number of the first line of each path
     mutable bool m_indexed = true;
-    mutable bool m_unique = true;       // no path stands twice
-    mutable bool m_indexClosed = false; // a line that is too short stands before what follows
+    mutable bool m_unique = true;       // no path occurs twice
+    mutable bool m_indexClosed = false; // a line that is too short precedes the lines that follow
 };
 
 } // namespace lumora

@@ -12,9 +12,9 @@ namespace lumora {
 // How many small pictures a page has.
 inline constexpr int cellsOfPage = 12;
 
-// Walks a list from its current index: up to twelve texts, those that read gives as empty left out. Behind a full page
-// the index stands on the first item of the next page; at the end of the list it stays on the last item, so that a
-// further page shows that one alone.
+// Reads a page from the list's current index on: up to twelve texts, without those that read gives as empty. After a
+// full page the index is that of the next page's first item; at the end of the list it stays at the last item, so that
+// a further page shows that item alone.
 QStringList FillPage(const QStringList& items, int& currentIndex, const std::function<QString(const QString&)>& read);
 
 // All paths of the folders picked so far; its current index is the reading position of the paging.
@@ -28,9 +28,9 @@ public:
 
     void clear();
 
-    // Adds the files of a folder and returns how many it added. A drive root that is picked twice stands once in the
-    // list, any other folder twice: a file is left out when folder and name, joined without a separator, are in the
-    // list. When the list grew, the reading position becomes the last of the old items, or the first picture.
+    // Adds the files of a folder and returns how many it added. A drive root that is picked twice is listed once, any
+    // other folder twice: a file is left out when folder and name, joined without a separator, are in the list. When
+    // the list grew, the reading position becomes the last of the old items, or the first picture.
     int addFolder(const DrivePath& folder, const QStringList& names);
 
     bool IsInFolderList(const QString& path) const { return m_known.contains(path); }
@@ -42,7 +42,7 @@ public:
 
 private:
     TextList m_paths;
-    QSet<QString> m_known; // beside the list, so that adding a folder of thousands stays instant
+    QSet<QString> m_known; // the list's items, so that adding a folder of thousands stays quick
 };
 
 } // namespace lumora

@@ -42,7 +42,7 @@ void PictureChoice::previousPage() {
 }
 
 void PictureChoice::chosenPage() {
-    // The list of a basket that was never paged stands before its first line; a page of chosen pictures begins with it.
+    // The reading position of a basket that was never paged is -1; its page begins with the first line.
     int index = std::max(m_basket.currentIndex(), 0);
     const int column = BasketLine::pathColumn(m_basket.form());
     const QStringList paths = FillPage(m_basket.lines().items(), index, [column](const QString& line) {
@@ -91,7 +91,7 @@ void PictureChoice::chooseAll() {
 
 int PictureChoice::storeRecord(const QString& path, const QString& record) {
     const int index = m_basket.FindByPath(path);
-    // The page in view may be another one by now, so that the copies are those of the line.
+    // The copies are those of the line, since another page may be in view by now.
     if (index >= 0)
         put({code(PrintCode::copiesOf(m_basket.item(index)), PaperWords::All).compose(), record, DrivePath(path)});
     return index;

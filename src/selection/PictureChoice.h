@@ -42,9 +42,9 @@ public:
     // No folder, no page and nothing chosen.
     void clear();
 
-    // A picture that is chosen already keeps its copies and its place in the basket. An empty record in the short form.
+    // A picture that is chosen already keeps its copies and its place in the basket. record is empty in the short form.
     void choose(int cell, const QString& record);
-    // The rest of a line stays, its record included; record is for a line that is not there. 0 takes the line out.
+    // The rest of a line stays, its record too; record is for a line that is added. 0 copies remove the line.
     void setCopies(int cell, int copies, const QString& record);
     // One copy of every picture of the folders.
     void chooseAll();

@@ -33,8 +33,8 @@ public:
         return static_cast<P&>(load(P::pageId));
     }
 
-    // Goes the way that the page flow has for what happened on a page: shows the next page and unloads the one that is
-    // left. False, and nothing happens, where no such page is registered.
+    // Follows the page flow from what happened on a page: shows the next page and unloads the one that is left. False,
+    // without any change, when the next page is not registered.
     bool follow(PageId from, Outcome outcome);
     bool canFollow(PageId from, Outcome outcome) const;
 

@@ -19,7 +19,8 @@ DrivePath counterFolder(const SessionState& state) {
     return state.DiskRoot / u"vedron";
 }
 
-// Blanks in front are passed over and digits are taken up to the first other character: "007x" is 7, rubbish is 0.
+// Blanks in front are passed over and digits are taken up to the first other character: "007x" is 7, a text without
+// digits is 0.
 long long counterValue(const QString& line) {
     long long value = 0;
     for (const QChar digit : line.trimmed()) {
@@ -96,7 +97,7 @@ DrivePath proofPicture(const SessionState& state) {
 } // namespace WorkspacePaths
 
 bool Workspace::MakeRootFolders() const {
-    // The answer counts, not the attempts: an older tree on a drive that has become read-only still serves.
+    // A failed creation does not matter when the folder exists, as on a drive that has become read-only.
     (void)m_files.makeFolder(WorkspacePaths::root(m_state));
     (void)m_files.makeFolder(WorkspacePaths::zmany(m_state));
     return m_files.folderExists(WorkspacePaths::zmany(m_state));
@@ -140,7 +141,7 @@ Result<void> Workspace::CleanWorkspace(QString& MisparHazmana) const {
     if (!m_files.fileExists(counter)) {
         MisparHazmana = u"100"_s;
     } else if (const Result<QByteArray> bytes = m_files.read(counter)) {
-        // A counter without a line, like one that can't be read, leaves the number as it was.
+        // An empty counter file, like an unreadable one, leaves the number as it was.
         if (const std::optional<QString> line = firstLine(*bytes))
             MisparHazmana = QString::number(counterValue(*line));
     }
@@ -172,7 +173,8 @@ Result<void> Workspace::writeCounter() const {
     return m_files.writeWhole(WorkspacePaths::counter(m_state), QByteArray::number(next) + "\r\n");
 }
 
-// The pattern knows no letter case, the test of the ending does: "a.Jpg" stays, and so does what can't be deleted.
+// The pattern ignores letter case and the test of the ending does not, so "a.Jpg" stays; so does a file that can't be
+// deleted.
 void Workspace::deleteMatching(const DrivePath& folder, const QString& ending) const {
     for (const QString& name : m_files.names(folder, u"*."_s + ending)) {
         if (name.endsWith(ending) || name.endsWith(ending.toUpper()))

@@ -48,8 +48,8 @@ public:
     // Removes the print files of the orders already made, but for the file at index 0 of each folder.
     void CleanHistory() const;
 
-    // The next order's number into the counter file. A file that is further on stays as it is, since an order that was
-    // taken up later must not give the numbers behind it a second time.
+    // Writes the next order's number into the counter file. A larger number in the file stays, since an order that was
+    // taken up later must not give the numbers after it a second time.
     Result<void> writeCounter() const;
 
 private:

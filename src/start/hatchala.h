@@ -33,8 +33,8 @@ struct hatchalaControls : Controls {
     Caption Label6{*this, u"Label6", Caption::At::Hidden};     // the countdown's seconds
     Caption Label7{*this, u"Label7", Caption::At::Hidden};     // the countdown's text
     Caption Label8{*this, u"Label8"};                          // the arrow that moves above the start button
-    Caption Label4How{*this, u"Label4How"};                    // the way to prints,
-    ControlArray<Caption, 3> Label4Step{*this, u"Label4Step"}; // and its steps
+    Caption Label4How{*this, u"Label4How"};                    // heading of the steps to prints
+    ControlArray<Caption, 3> Label4Step{*this, u"Label4Step"}; // the steps
     Caption Picture1{*this, u"Picture1", Caption::At::Hidden}; // the panel that asks for the shop
     Caption List1Caption{*this, u"List1Caption"};              // what is asked
     TextList List1{*this, u"List1"};                           // where the prints are fetched; row 0 is the first shop

@@ -23,7 +23,7 @@ public:
     // True as often as the counter says.
     static bool strikes(int& counter);
 
-    // How often from now on; always is for good.
+    // How often each fault happens from now on; always means every time.
     int deadOpens = 0;    // the machine has no way out
     int deadConnects = 0; // nobody answers
     Failure::Kind deadConnectKind = Failure::Kind::Disconnected;

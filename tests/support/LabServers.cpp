@@ -86,7 +86,7 @@ LabServers::~LabServers() {
     QProcess stop;
     stop.start(script("stop"), {m_folder.path()});
     stop.waitForFinished(60'000);
-    // Names of bytes that are no text are beyond the temporary folder's own removal.
+    // QTemporaryDir does not remove names whose bytes are no text.
     std::error_code error;
     std::filesystem::remove_all(folder(), error);
 }

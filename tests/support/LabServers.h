@@ -46,7 +46,7 @@ public:
     // The request lines as the web server saw them, in order. The server writes a line when it has answered, so this
     // waits a little while for at least so many.
     QByteArrayList requests(int atLeast = 0) const;
-    // What the lab's scripts took from them.
+    // The reports among them, as the lab's scripts wrote them down.
     QByteArrayList reports() const;
     // The FTP server's log of commands and replies.
     QByteArray ftpLog() const;

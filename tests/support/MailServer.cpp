@@ -13,7 +13,7 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-// A server that takes mail for others is started by root and nobody else; it works on as a user of its own.
+// A mail server is started by root and then runs as a user of its own.
 QStringList asRoot(const QStringList& command) {
     return ::geteuid() == 0 ? command : QStringList{u"sudo"_s, u"-n"_s} + command;
 }
@@ -24,8 +24,8 @@ QByteArray outputOf(QStringList command) {
     return process.waitForFinished(60'000) ? process.readAllStandardOutput() : QByteArray();
 }
 
-// In the open the server asks for a proof and takes the password too; encrypted it takes the password alone, in one way
-// on each port. So each of the ways is walked.
+// Unencrypted the server offers challenge and response besides the password; encrypted it takes the password alone, by
+// another command on each port. So a test can use each way of logging in.
 const char* const configuration = R"(primary_hostname = mail.lab.example
 spool_directory = %1/spool
 log_file_path = %1/log/%slog
@@ -116,7 +116,7 @@ MailServer::~MailServer() {
             m_server.kill();
         m_server.waitForFinished(5'000);
     }
-    // What the server's user has made is beyond the temporary folder's own removal.
+    // QTemporaryDir does not remove the files of the server's user.
     outputOf(asRoot({u"rm"_s, u"-rf"_s, m_folder.path()}));
 }
 
@@ -129,7 +129,7 @@ QString MailServer::configure(Disk disk, Encryption encryption) const {
     text.replace(u"%3"_s, QString::number(m_tlsPort));
     text.replace(u"%4"_s, encryption == Encryption::Offered ? u"*"_s : QString());
     text.replace(u"%5"_s, QString::number(largestMessage));
-    // No disk has so much room left as the full one asks for.
+    // The full server asks for more free space than any disk has.
     text.replace(u"%6"_s, disk == Disk::Full ? u"1000000G"_s : u"0"_s);
     text.replace(u"%7"_s, known.user);
     text.replace(u"%8"_s, known.password);
@@ -137,7 +137,7 @@ QString MailServer::configure(Disk disk, Encryption encryption) const {
     if (file.open(QIODevice::WriteOnly | QIODevice::Truncate))
         file.write(text.toUtf8());
     file.close();
-    // It takes only a file of the user who starts it, and that no other may write to.
+    // The server accepts only a file that belongs to the user who starts it and that no other user may write.
     file.setPermissions(static_cast<QFile::Permissions>(0x6644));
     outputOf(asRoot({u"chown"_s, u"root"_s, path}));
     return path;
@@ -171,7 +171,7 @@ MailAccount MailServer::account(MailEncryption encryption) const {
 }
 
 QByteArray MailServer::mailbox() const {
-    // The server takes a message first and lays it into the box then.
+    // The server delivers a message to the mailbox after it has accepted it.
     QElapsedTimer waiting;
     waiting.start();
     while (waiting.elapsed() < 60'000 && log().count(" <= ") > log().count(" Completed\n"))

@@ -47,7 +47,7 @@ OtherFtpServer::~OtherFtpServer() {
         m_server.kill();
         m_server.waitForFinished(5'000);
     }
-    // Names of bytes that are no text are beyond the temporary folder's own removal.
+    // QTemporaryDir does not remove names whose bytes are no text.
     std::error_code error;
     std::filesystem::remove_all(account(), error);
 }
@@ -83,7 +83,7 @@ void OtherFtpServer::write(const QString& name, const QString& text) const {
     file.setPermissions(QFile::ReadOwner | QFile::WriteOwner);
 }
 
-// Without a closed root: its PWD tells the whole path.
+// Without chroot, so that PWD tells the whole path.
 QStringList OtherFtpServer::prepareProFtpd() {
     m_program = find(u"/usr/sbin/proftpd"_s);
     const QString hash = run(u"openssl"_s, {u"passwd"_s, u"-6"_s, password()});
@@ -108,7 +108,7 @@ QStringList OtherFtpServer::preparePureFtpd() {
         return {};
     m_program = find(u"/usr/sbin/pure-ftpd"_s);
     const QString hash = run(u"openssl"_s, {u"passwd"_s, u"-6"_s, password()});
-    // It takes no account of root's.
+    // It refuses the account of root.
     write(u"passwd"_s, u"%1:%2:65534:65534::%3/./::::::::::::\n"_s.arg(user(), hash, toText(account())));
     std::filesystem::permissions(account(), std::filesystem::perms::all);
     run(find(u"/usr/bin/pure-pw"_s), {u"mkdb"_s, m_folder.filePath(u"db"_s), u"-f"_s, m_folder.filePath(u"passwd"_s)});

@@ -22,7 +22,7 @@ public:
     OtherFtpServer(const OtherFtpServer&) = delete;
     OtherFtpServer& operator=(const OtherFtpServer&) = delete;
 
-    // It is not on this machine, or not for this user.
+    // True when the server is not installed or does not run for this user.
     bool absent() const { return m_program.isEmpty(); }
     bool running() const { return m_failure.isEmpty(); }
     QString failure() const { return m_failure; }

@@ -9,7 +9,7 @@
 
 namespace lumora {
 
-// What the test of a page stands on: a fresh machine, the session, and the chain with the pages that the test names.
+// What the test of a page needs: a fresh machine, the session, and the chain with the pages that the test names.
 struct PageRig {
     PageRig() { state.DiskRoot = machine.drives.programRoot(); }
 

@@ -8,7 +8,7 @@
 #include <filesystem>
 #include <vector>
 
-// Generated pictures that weigh on a decoder, a scaler and an encoder as photographs do: a scene with soft and hard
+// Generated pictures that cost a decoder, a scaler and an encoder as much as photographs do: a scene with soft and hard
 // edges, texture of all sizes in some places and calm in others, and the noise of a camera (about 1.9 bits a pixel at
 // quality 92). The same seed gives the same bytes.
 namespace lumora {

@@ -6,8 +6,8 @@
 
 namespace lumora {
 
-// A disk of so many kilobytes, mounted on a temporary folder while this lives, or one that can only be read. It takes
-// the right to mount (root): a test asks available() first and skips where an ordinary user runs it.
+// A disk of so many kilobytes, mounted on a temporary folder while this lives, or one that can only be read. Mounting
+// needs root: a test asks available() first and is skipped for an ordinary user.
 class SmallDisk {
 public:
     explicit SmallDisk(int kilobytes);

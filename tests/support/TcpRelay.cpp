@@ -43,7 +43,7 @@ int connectTo(quint16 port) {
     return -1;
 }
 
-// As a line that breaks: no orderly end, the other side gets a reset.
+// Ends the connection with a reset, as a broken line does.
 void reset(int socket) {
     const linger atOnce{1, 0};
     ::setsockopt(socket, SOL_SOCKET, SO_LINGER, &atOnce, sizeof(atOnce));
@@ -156,7 +156,7 @@ void TcpRelay::pumpBytes(int client, int server) {
             if (both[from].revents == 0)
                 continue;
             const Faults now = faults();
-            // A plain line counts the answer only.
+            // In front of another server only the answer's bytes count.
             const bool counted = m_kind == Kind::Ftp || from == 1;
             const qint64 limit = !counted ? -1 : now.cutDataAfter >= 0 ? now.cutDataAfter : now.stallDataAfter;
             std::size_t room = bytes.size();
@@ -203,7 +203,7 @@ void TcpRelay::data(int listener, quint16 serverPort) {
         pumpBytes(client, server);
 }
 
-// A reply that names a data port gets one of ours in its place.
+// Replaces the data port in a reply by one of the relay.
 QByteArray TcpRelay::ownPort(const QByteArray& reply) {
     int serverPort = 0;
     if (reply.startsWith("229 ")) {

@@ -44,7 +44,7 @@ public:
     quint16 port() const { return m_port; }
     QString host() const { return u"127.0.0.1:%1"_s.arg(m_port); }
 
-    // For what happens from now on.
+    // Applies from now on.
     void setFaults(const Faults& faults);
     int faultsMade() const { return m_made; }
     // The command lines that clients sent, without their line ends.

@@ -72,7 +72,7 @@ Result<QByteArray> EditedPreparation::renderPicture(const BasketLine& line, Edit
     return made.jpeg;
 }
 
-// The copy of a corrected picture is looked for among the red-eye copies too, under the name of the copy itself.
+// The tone copy of a corrected picture is kept among the red-eye copies too, under the tone copy's own name.
 Result<void> EditedPreparation::keepToneCopy(const BasketLine& line, NewContent& copy) {
     EditFields edit;
     UnpackEditState(line.editState, edit);
@@ -100,7 +100,8 @@ void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& s
     m_events.printed(*preview);
     NewContent thumbnail(*target, path.text());
     appendBmp(*preview, thumbnail, [] { return false; });
-    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing)); // its cell of the sheet stays empty
+    // Without a thumbnail the picture's cell of the sheet stays empty.
+    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing));
 }
 
 std::optional<Bitmap> EditedPreparation::drawSheet() {

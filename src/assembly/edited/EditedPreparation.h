@@ -13,7 +13,7 @@ public:
 
     // The folder of the sheet's pictures. Without it the sheet has none, and the order goes on.
     void makeJobFolder() const;
-    // False, and told, when the order is not whole, or when a click ended the program.
+    // False, and told, when the order is not complete, or when a click ended the program.
     bool prepare(const QStringList& lines, std::optional<PaperSize> paper);
 
 private:

@@ -27,8 +27,8 @@ struct EditedPrintResult {
 };
 
 // The prints of an edited order, rendered ahead of the steps that pack them, one for each line with a usable name. Only
-// values go into that work. A line that is marked "RED" is rendered from the corrected copy, and when that has vanished
-// it is a failure: the uncorrected picture is not what the customer saw.
+// values go into that work. A line that is marked "RED" is rendered from the corrected copy, and a missing copy is a
+// failure, since the customer did not see the uncorrected picture.
 class EditedPrints {
 public:
     // items as List1 holds them. Without a paper every print is a failure.

@@ -18,7 +18,7 @@ public:
     bool isAlbum() const;
     // No value when a click ended the program.
     std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines);
-    // False, and told, when the order is not whole, or when a click ended the program.
+    // False, and told, when the order is not complete, or when a click ended the program.
     bool prepare(const QStringList& lines);
 
 private:

@@ -77,7 +77,7 @@ gdisave::gdisave(const SessionState& state, const Platform& platform, PageChain&
 
 void gdisave::load() {
     GdiReady = false;
-    // This system's drawing needs no start, so only a starter that was handed in can fail.
+    // Drawing needs no start on this system, so only a starter that the caller gives can fail.
     const int status = m_start ? m_start() : 0;
     ShowGdiStatus(status);
     if (status != 0)

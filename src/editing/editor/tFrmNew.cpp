@@ -33,7 +33,7 @@ tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain
     , Timer6(holdMilliseconds, [this] { turn(); })
     , Timer7(holdMilliseconds, [this] { moveAcross(); })
     , Timer8(holdMilliseconds, [this] { moveDown(); }) {
-    // Nobody holds a button of this page once another page is in front.
+    // No button of this page is held once another page is in front.
     connect(&chain, &PageChain::shown, this, &tFrmNew::stopHolds);
 }
 

@@ -262,7 +262,7 @@ private:
     PageChain& m_chain;
     FrameLists m_frames;
 
-    DragHandle Image3; // unseen: its place is PanX and PanY, with fractions
+    DragHandle Image3; // has no widget; its position is PanX and PanY with fractions
     DragHandle m_labelHandle;
     DragHandle m_cropHandle;
     CropFrame::Corner m_cropCorner = CropFrame::Corner::Picture11;

@@ -94,7 +94,8 @@ void RedI::open(const DrivePath& path) {
     }
     caption = path.text();
     m_sight.open({opened->picture.width(), opened->picture.height()});
-    static_cast<void>(Workspace(m_state, m_platform.files).MakeWorkspace()); // what failed is told when it is needed
+    // A failure is told when the folders are needed.
+    static_cast<void>(Workspace(m_state, m_platform.files).MakeWorkspace());
     const DrivePath undoCopy = WorkspacePaths::tempred(m_state) / u"000.bmp";
     m_picture.begin(std::move(opened->picture), std::move(opened->overview), opened->overviewSize,
                     drives.toHost(undoCopy).value_or(HostPath()));
@@ -198,7 +199,7 @@ void RedI::magnify(int to) {
         showState();
 }
 
-// Another place is another eye, so what was found for the last one is forgotten.
+// The lists belong to the eye at the former place.
 void RedI::place(QPoint centre) {
     m_sight.place(centre);
     RedTargetRectangle.visible = true;

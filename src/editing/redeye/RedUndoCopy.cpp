@@ -16,7 +16,7 @@ void RedUndoCopy::begin(const Bitmap& picture, const std::filesystem::path& file
     m_file = file;
     m_waiting.emplace(m_file, QString::fromLocal8Bit(m_file.c_str()));
     m_written = false;
-    // The thread has the picture to itself: nobody changes it before finishWriting() has joined the thread.
+    // Only the thread uses the picture until finishWriting() has joined the thread.
     m_writer = std::jthread([this, copy = Bitmap(picture)](const std::stop_token& stop) mutable {
         appendBmp(copy, *m_waiting, [&stop] { return stop.stop_requested(); });
         copy = Bitmap();
@@ -37,7 +37,7 @@ Result<void> RedUndoCopy::finishWriting(const Bitmap& picture) {
         m_writer.join();
     Result<void> written = m_waiting ? commitWaiting() : Failure{};
     if (!written) {
-        // The background writing failed; there may be room and a folder by now.
+        // The background writing failed; a second try may find room and a folder.
         m_waiting.emplace(m_file, QString::fromLocal8Bit(m_file.c_str()));
         appendBmp(picture, *m_waiting, [] { return false; });
         m_differs = {};

@@ -35,7 +35,7 @@ public:
     // Brings the file to the picture as it is now, before the part changes. Waits for the background writing.
     Result<void> keep(const Bitmap& picture, const QRect& part);
 
-    // The picture was changed in this region by other ways than a change that keep() announced.
+    // The picture was changed in this region without a keep() before.
     void changedOtherwise(const QRegion& region);
 
     // True when there is a step to take back.

@@ -13,8 +13,8 @@ std::optional<AlbumProblem> CheckAlbum(const SessionState& state, const QString&
     using Place = AlbumProblem::Place;
     const AlbumDetails& album = state.album;
     const auto prompt = [&](AlbumChoice choice) { return albumPrompt(choice, state.english()); };
-    // One letter less than the list's prompt, on purpose: an untouched list passes, and the prompt goes out as the
-    // paper.
+    // This text is one letter shorter than the list's prompt, so that a list without a choice passes and the prompt is
+    // sent as the paper.
     const QString untouchedPaper = u"בחר סוג ניר"_s;
     const struct {
         bool missing;

@@ -25,7 +25,7 @@ public:
     enum class Panel { Photographer, Kind, Size, Cover, Paper, Extras, Bill };
     static constexpr int panelCount = 7;
 
-    // A new album: nothing is chosen, and the photographer's panel is open. Who the photographer is stays.
+    // A new album: nothing is chosen, and the photographer's panel is open. The photographer's details stay.
     void begin();
     void close();
     // One panel back; false on the first.
@@ -69,13 +69,13 @@ public:
 Q_SIGNALS:
     void changed();
     void focusWanted(const QString& control);
-    // The album passed its check and stands in the session.
+    // The album has passed its check and is in the session.
     void checked();
 
 private:
     struct PanelRow;
     std::vector<PanelRow> panelTable();
-    // The four lists that stand on panels of their own.
+    // The four lists that have a panel of their own.
     struct ListRow {
         Panel panel;
         ComboCaption& list;

@@ -27,7 +27,7 @@ public:
     // empty.
     Result<void> SaveDetails(const Customer& customer) const;
     Result<std::optional<Customer>> details() const;
-    // The next customer at this machine finds nothing. No file is success.
+    // Removes the file, so that the next customer at this machine does not see it. A missing file is no failure.
     Result<void> forgetDetails() const;
 
     struct Photographer {

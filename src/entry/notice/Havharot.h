@@ -28,8 +28,8 @@ public:
     Havharot(const SessionState& state, const Platform& platform, PageChain& chain);
 
     void setTexts() override;
-    // A plain page with just a way back, for a tile behind which this lab has put nothing. With the details page gone
-    // the way back leads to the start page.
+    // A page with a way back only, for a tile that this lab does not use. Without the details page the way back leads
+    // to the start page.
     void showPlain();
 
     // --- events ---

@@ -125,7 +125,7 @@ void FtpSessionWire::close() {
     try {
         m_control.socket.setSendTimeout(Poco::Timespan(1, 0));
         sendAll(m_control.socket, "QUIT\r\n", 6);
-    } catch (const std::exception&) { // a line that is gone needs no farewell
+    } catch (const std::exception&) { // QUIT is not needed on a broken line
     }
     m_control = {};
 }

@@ -11,9 +11,10 @@
 
 namespace lumora {
 
-// An answer that is kept in memory is a few words of a script.
+// In bytes. An answer that is kept in memory is a few words of a script.
 constexpr qsizetype largestFetchedBody = 16 * 1024 * 1024;
-// One that becomes a file is a list or a picture of the start page; a server that never ends must not fill the disk.
+// In bytes. An answer that becomes a file is a list or a picture of the start page; an endless one must not fill the
+// disk.
 constexpr qint64 largestDownload = 64 * 1024 * 1024;
 
 // Takes the next bytes of the body; false gives the answer up.
@@ -32,12 +33,12 @@ struct HttpAnswer {
 Result<HttpAnswer> HttpGet(const QString& url, const LineCall& line, const BodySink& sink);
 Result<HttpAnswer> HttpHead(const QString& url, const LineCall& line);
 
-// The body goes out from where it lies, in pieces, and is never copied whole. Only 307 and 308 repeat the POST; any
-// other redirect is a failure.
+// The body is sent in pieces and never copied as a whole. Only 307 and 308 repeat the POST; any other redirect is a
+// failure.
 Result<HttpAnswer> HttpPost(const QString& url, const PostRequest& post, const LineCall& line, const BodySink& sink);
 
-// The request target as it goes over the wire: the ANSI bytes of the text from behind the host on, CR, LF and NUL made
-// blanks, a blank made %20, since a raw one would end the target in the request line. Nothing else is touched.
+// The request target in bytes: the text after the host in the ANSI code page, with a blank for each CR, LF and NUL and
+// %20 for each blank, since a raw blank would end the target.
 QByteArray HttpTarget(const QString& pathAndQuery);
 
 } // namespace lumora

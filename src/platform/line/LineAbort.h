@@ -17,7 +17,7 @@ public:
     LineAbort(const LineAbort&) = delete;
     LineAbort& operator=(const LineAbort&) = delete;
 
-    // Cuts every watched socket. Those that are watched later are not concerned.
+    // Cuts every watched socket. Sockets that are watched later are not cut.
     void abort();
     // How often abort() was called; a dialogue that began at another count has been cut.
     int count() const { return m_count; }

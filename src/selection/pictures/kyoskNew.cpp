@@ -35,7 +35,7 @@ AddressBox kyoskNew::addressBox() const {
 }
 
 void kyoskNew::load() {
-    // Nothing of the last picture of an order before.
+    // Nothing stays of the last picture of an earlier order.
     UnpackEditState(EditRecord::newPicture(), m_state.edit);
     m_state.edit.PicturePath = {};
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
@@ -57,7 +57,7 @@ void kyoskNew::load() {
     showChoice();
     if (plain())
         return;
-    // Once an order, with this page.
+    // This page makes the editor once for each order.
     m_chain.load<tFrmNew>();
     connect(&editor(), &tFrmNew::stored, this, &kyoskNew::storeRecord);
     connect(&editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);

@@ -20,9 +20,8 @@ struct SessionState;
 class tFrmNew;
 
 // kyoskNew, "choosing the pictures" in the glossary: the customer finds the pictures of an order, chooses and counts
-// them, and sends them on.
-//
-// Clicks may arrive while the small pictures are drawn: a redraw that a later one overtook stops at once.
+// them, and sends them on. Clicks may arrive while the small pictures are drawn, so a redraw stops when a later one has
+// begun.
 class kyoskNew : public Page, private kyoskNewControls {
     Q_OBJECT
 public:
@@ -106,7 +105,7 @@ public:
     bool plain() const;
     // The cell whose picture is open in the editor, or -1.
     int openCell() const { return m_openCell; }
-    // A folder was picked or a picture chosen: the cells stand where the first step stood.
+    // A folder was picked or a picture chosen: the cells replace the first step.
     bool showsCells() const { return !List4.isEmpty() || !List1.isEmpty(); }
     // The box of the closing panel that takes the address.
     AddressBox addressBox() const;

@@ -33,7 +33,7 @@ void kyoskNew::setCellPixels(int pixels) {
     if (pixels < 1 || pixels == m_cellPixels)
         return;
     m_cellPixels = pixels;
-    // A view may tell its resolution while it renders; drawing pumps and has to wait for the next turn.
+    // A view may call this while it renders. Drawing pumps events, so it waits for the next turn of the event loop.
     QMetaObject::invokeMethod(
         this,
         [this] {

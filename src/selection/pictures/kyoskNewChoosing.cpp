@@ -77,7 +77,7 @@ void kyoskNew::setCopies(int cell, int copies) {
         if (m_openCell == cell)
             m_openCell = -1;
         if (!plain() && wasInBasket)
-            repaint(path); // as the file is: chosen again it begins without its edits
+            repaint(path); // as its file is, since a picture chosen again begins without edits
     }
     showChoice();
 }
@@ -139,7 +139,7 @@ void kyoskNew::storeRecord() {
     if (!written && !m_handOverFailed)
         m_platform.dialogs.message(written.failure().message);
     m_handOverFailed = !written;
-    // Behind the editor the small picture is painted when the customer comes back.
+    // While the editor is in front, the small picture is left until the customer comes back.
     if (m_chain.front() == this)
         repaint(path);
 }

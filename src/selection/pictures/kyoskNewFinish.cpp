@@ -90,7 +90,7 @@ void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
         Command4Snif[branch].text = m_state.profile.Branches[branch].caption;
-    // The lab names the shops; home delivery is our own word.
+    // The lab's file names the shops; the name of home delivery is fixed.
     if (m_state.english())
         Command4Snif.back().text = u"Home delivery"_s;
     // A lab with fewer shops leaves captions empty.

@@ -52,7 +52,7 @@ const std::vector<CardField> cardFields = {
 } // namespace
 
 QString SettingsText(const ClientProfile& profile) {
-    // The first piece is written twice: a reader drops it from its list.
+    // The first piece is written twice, since a reader drops it from its list.
     QString text = piece(u"TK1="_s, profile.FtpFolder1) + piece(u"TK1="_s, profile.FtpFolder1) +
                    piece(u"TK2="_s, profile.FtpFolder2) + piece(u"ASP="_s, profile.ClientCode) +
                    piece(u"SRT="_s, profile.FtpServer) + piece(u"PAS="_s, profile.FtpPassword) +

@@ -149,7 +149,7 @@ void MoogMeretView::renderFiles() {
     for (int row = 0; row < m_fileList->count(); ++row) {
         QListWidgetItem* item = m_fileList->item(row);
         item->setFlags(item->flags() & ~Qt::ItemIsUserCheckable); // the page turns the mark over
-        item->setFont(theme().font(Theme::Type::Small));          // a name says much, and its end most
+        item->setFont(theme().font(Theme::Type::Small));          // small letters show more of a long name
         item->setCheckState(m_page.files().isMarked(row) ? Qt::Checked : Qt::Unchecked);
     }
     m_fileList->setAccessibleName(c.Label4Shalav2.text);

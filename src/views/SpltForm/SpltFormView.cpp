@@ -12,7 +12,8 @@ using namespace Qt::StringLiterals;
 
 SpltFormView::SpltFormView(SpltForm& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme) {
-    // No part of an order's way; its room keeps the name at its place.
+    // The page is no step of an order; the hidden step bar keeps its room, so that the product's name stays in its
+    // place.
     keepPlaceWhenHidden(frame().steps());
     frame().steps().hide();
     frame().content()->addLayout(inRow(Space::Wide, {{makeCut(), 2}, {makeJoin(), 3}}), 1);
@@ -45,7 +46,7 @@ QVBoxLayout* SpltFormView::makeList(const TextList& rows, const Caption& caption
     return inColumn(Space::Small, {title, {made, 1}});
 }
 
-// The chief work of a column. The bottom bar's main action would be one too many here.
+// The main button of a column; this page has no main action in its bottom bar.
 QPushButton* SpltFormView::workButton(const Caption& caption, void (SpltForm::*clicked)()) {
     QPushButton* made = button(caption, Role::Main, clicked);
     setRole(made, "done");

@@ -75,7 +75,7 @@ void ArrowStrip::paintEvent(QPaintEvent*) {
     const QRectF at = place();
     const double arm = m_theme.px(6);
     QColor colour = Theme::Colour::Primary;
-    // Faint where the way begins and ends, so that the return to its beginning is not seen.
+    // The arrows are faint at both ends of their way, so that their return to the top is not seen.
     colour.setAlphaF(static_cast<float>(0.25 + 0.6 * std::sin(m_phase * std::numbers::pi)));
     painter.setPen(QPen(colour, m_theme.thick(), Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     const double top = at.top() + m_theme.px(6) + m_phase * m_theme.px(6);

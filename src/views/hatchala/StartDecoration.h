@@ -9,10 +9,10 @@
 
 namespace lumora {
 
-// What lives on the start page without being a control. Each piece paints itself alone: a step of its motion asks for
-// no layout and for no other widget.
+// The moving decoration of the start page. Each piece repaints only itself, so that a step of its motion needs no
+// layout and no other widget.
 
-// Three prints on a table: what the customer goes home with.
+// Three prints on a table.
 class Prints : public QWidget {
     Q_OBJECT
 public:

@@ -66,7 +66,7 @@ QLayout* hatchalaView::makeWords() {
 }
 
 QLayout* hatchalaView::makeSide() {
-    // Right below the button that it speaks of.
+    // This hint is right below its button, the exit.
     m_hints.push_back(makeHint(c.Label4, u"exit"_s));
     QWidget* stage = makeStage();
     m_advert = new AdvertisingPicture(theme(), this);
@@ -77,7 +77,7 @@ QLayout* hatchalaView::makeSide() {
                                    {makeContact(), 0, Qt::AlignCenter}});
 }
 
-// The prints, and in their place what the control in hand does.
+// The prints, or in their place the help of the control under the pointer.
 QWidget* hatchalaView::makeStage() {
     m_prints = new Prints(this);
     QLabel* head = label(c.Picture3, "muted");
@@ -93,7 +93,6 @@ QWidget* hatchalaView::makeStage() {
     auto* place = inGrid(Space::None);
     place->addWidget(m_prints, 0, 0);
     place->addWidget(help, 0, 0);
-    // Their place in the state is the one of the prints at the back and of the one in front.
     return inBox(place);
 }
 
@@ -201,12 +200,12 @@ QWidget* hatchalaView::firstFocus() const {
     return m_start;
 }
 
-// A step of a motion: whatever moves paints itself, and nothing else does anything.
+// A step of a motion repaints the moving pieces only.
 void hatchalaView::renderMotion() {
     if (isDetached())
         return;
     const StartMotion& motion = m_page.motion();
-    // Every second step is as much as an eye follows.
+    // Only every second step is painted; the eye sees no difference.
     const int step = (motion.Label8Top() - StartMotion::arrowTop) / 2 * 2;
     m_arrow->setPhase(static_cast<double>(step) / (StartMotion::arrowBottom - StartMotion::arrowTop));
     m_advert->setOpening(static_cast<double>(motion.Picture4Width()) / StartMotion::pictureWidth);
@@ -223,7 +222,7 @@ void hatchalaView::renderHelp() {
     for (const Help& help : m_helps)
         help.text->setText(c.Image12[static_cast<std::size_t>(help.over)].text);
     const bool shown = m_page.hover() != hatchala::Hover::Nothing;
-    // In English the page leaves the prints where they are; the help needs their place all the same.
+    // In English the page keeps the prints visible, and the help is shown in their place.
     m_prints->show(c.Picture2.visible && !shown, c.Image2.visible && !shown);
     for (const Hint& hint : m_hints)
         hint.text->setText(hint.caption->text.trimmed());

@@ -159,7 +159,7 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
     m_drawing(painter, QRectF(room.topLeft(), line.topRight()), text());
     painter.restore();
     if (m_ribbon.isValid()) {
-        // A bookmark on the side away from the mark of the choice.
+        // A ribbon on the side opposite to the mark of the choice.
         const double width = theme().size(Space::Wide);
         const double top = room.top() - theme().gap();
         const double bottom = top + theme().px(34);

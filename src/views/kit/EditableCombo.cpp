@@ -10,7 +10,7 @@ EditableCombo::EditableCombo(QWidget* parent, std::function<void(int)> chosen,
     : QComboBox(parent) {
     setEditable(true);
     setInsertPolicy(QComboBox::NoInsert);
-    setProperty("ownRing", true); // its border tells
+    setProperty("ownRing", true); // its border shows the focus
     connect(this, &QComboBox::activated, this, [chosen = std::move(chosen)](int row) { chosen(row); });
     connect(lineEdit(), &QLineEdit::textEdited, this, [typed = std::move(typed)](const QString& text) { typed(text); });
 }

@@ -7,9 +7,9 @@
 namespace lumora {
 
 // A button that works as long as it is held. The page's own timer does the work: down() starts it, up() ends it, also
-// when the pointer or the keyboard leaves the button, or the button is hidden or disabled under it. Ahead of up() comes
-// tap() when the button was let go and not taken away: there the page makes up for a timer that has not ticked yet, so
-// that a tap is one step.
+// when the pointer or the keyboard leaves the button, or the button is hidden or disabled under it. tap() comes before
+// up() when the button was released and not lost: the page then makes one step if its timer has not ticked yet, so that
+// a tap is one step.
 class HoldButton : public QPushButton {
     Q_OBJECT
 public:

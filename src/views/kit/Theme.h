@@ -21,7 +21,7 @@ enum class Pad { Tight, Slim, Normal, Wide };
 // The side of an icon: of a small key, of a button, at a line of words, of a box, of an empty page.
 enum class IconSize { Small, Button, Line, Box, Page };
 
-// The extent of what has a size of its own: a small drawing, a short field, a wide one, a bar, a form.
+// Widths and heights: of a small drawing, a short field, a wide one, a bar, a form.
 enum class Extent { Drawing, Field, WideField, Bar, Form };
 
 // The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
@@ -53,7 +53,7 @@ public:
         static constexpr QColor Veil{0x1D, 0x25, 0x2C, 0x99}; // over a page that has a panel in front
     };
 
-    // Of the largest logical page that fits the window.
+    // The factor of the largest logical page that fits the window.
     static double factorFor(QSize window);
 
     explicit Theme(double factor)

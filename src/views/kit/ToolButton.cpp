@@ -39,7 +39,7 @@ void ToolButton::setMarked(bool marked) {
 
 QFont ToolButton::words() const {
     QFont font = m_theme.font(Theme::Type::Small);
-    font.setBold(false); // said, or the painter would take the weight of a button
+    font.setBold(false); // the painter would otherwise use the weight of a button
     return font;
 }
 

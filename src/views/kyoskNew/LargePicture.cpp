@@ -52,7 +52,7 @@ void LargePicture::paintEvent(QPaintEvent*) {
         QStringList lines;
         for (const QString& line : m_view.guide) {
             const QString words = line.trimmed();
-            // A row of arrows pointed to the small pictures; here the page's own layout does.
+            // The row of arrows is left out, since the layout shows where the small pictures are.
             if (!words.isEmpty() && words != QString(words.size(), u'<'))
                 lines += words;
         }

@@ -24,7 +24,7 @@ PictureCell::PictureCell(const Theme& theme, QWidget* parent)
     m_minus = key(u"minus"_s);
     m_plus = key(u"plus"_s);
     m_copies = centred(make.oneLine("large"));
-    // Minus stands left of plus in both languages, as on every counter.
+    // Minus is left of plus in both languages.
     m_strip = make.leftToRight(make.inRow(Space::None, {m_minus, {m_copies, 1}, m_plus}));
     m_strip->hide();
 }
@@ -108,7 +108,7 @@ void PictureCell::paintEvent(QPaintEvent*) {
             size.scale(room.size(), Qt::KeepAspectRatio);
         QRectF at(QPointF(), size);
         at.moveCenter(QRectF(room).center());
-        // On whole pixels, or every picture would be drawn soft.
+        // The picture begins on a whole pixel; between pixels it would be drawn blurred.
         at.moveTopLeft(QPointF(at.topLeft().toPoint()));
         painter.fillRect(at.translated(theme().hair(), theme().hair()), QColor(0, 0, 0, 30));
         painter.drawImage(at, m_look.picture);

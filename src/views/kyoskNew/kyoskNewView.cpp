@@ -174,7 +174,7 @@ void kyoskNewView::makeQuestions() {
 }
 
 void kyoskNewView::makeClosingPanel() {
-    // The keyboard goes the way the controls are made.
+    // The tab order is the order in which the controls are made.
     QPushButton* prices = button(c.Image17, Role::Quiet, &kyoskNew::Image17_Click, u"tag"_s);
     m_mail = field(c.Text1, toPage(&kyoskNew::Text1_Change));
     m_mail->setInputMethodHints(Qt::ImhEmailCharactersOnly);

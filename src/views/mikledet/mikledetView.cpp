@@ -141,7 +141,7 @@ QWidget* mikledetView::makeKeys() {
     enter->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     grid->addWidget(enter, 1, keyColumns, 2, 1);
 
-    // As on a telephone.
+    // The digits lie as on a telephone.
     constexpr int digits = keyColumns + 2;
     for (int digit = 1; digit <= 9; ++digit)
         grid->addWidget(key(KeyLayout::firstDigit + digit), (digit - 1) / 3, digits + (digit - 1) % 3);
@@ -187,7 +187,7 @@ void mikledetView::keyPressEvent(QKeyEvent* event) {
 
 void mikledetView::showIcon(QPushButton* button, const QString& icon) {
     if (button->property("shownIcon") == icon)
-        return; // a button that is given its icon again paints itself again
+        return; // setting the same icon would repaint the button
     button->setProperty("shownIcon", icon);
     setIcon(button, icon, Theme::Colour::Ink);
 }

@@ -154,7 +154,7 @@ QWidget* nnnView::makeBorders() {
 }
 
 QWidget* nnnView::makeFit() {
-    // Whole on the paper, or over all of it.
+    // Fit shows the whole picture on the paper; fill covers the whole paper.
     const auto card = [&](const CheckCaption& caption, QSizeF shape, void (nnn::*clicked)()) {
         auto* made = new DrawingCard(theme(), this,
                                      [shape](QPainter& painter, const QRectF& place, const QString&) {

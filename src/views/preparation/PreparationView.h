@@ -17,7 +17,7 @@ protected:
     PreparationView(PreparationPage& page, const SessionState& state, const Theme& theme, const Caption& title,
                     const Caption& warning, const Caption& warningBelow);
 
-    // What all went wrong; shown where the page says so.
+    // The card of what went wrong, for pages that show it.
     const Card& trouble() const { return m_trouble; }
     // The column beside the progress: cards of a page's own around the sheet's.
     QVBoxLayout* side() const { return m_side; }

@@ -52,8 +52,8 @@ void SendingView::render() {
     changeRole(m_mainActions.at(SendingButton::NewOrder), look.main == SendingButton::NewOrder ? "main" : "secondary");
     if (frontOverlay(*window()))
         return;
-    // A button that hides hands the keyboard to its neighbour: the second half of a double press would stop what the
-    // first half has started. Where the phase has no main action the page itself takes it.
+    // A button that hides passes the focus to its neighbour, which the second half of a double press would then press.
+    // Without a main action the page itself takes the focus.
     const auto action = m_mainActions.find(look.main);
     QWidget* main = action == m_mainActions.end() ? static_cast<QWidget*>(this) : action->second;
     if (std::exchange(m_main, main) != main)

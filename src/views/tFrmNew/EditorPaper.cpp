@@ -57,7 +57,7 @@ EditorPaper::EditorPaper(tFrmNew& page, QWidget* parent)
 void EditorPaper::render() {
     m_scale = m_shown.PicPicSize.width > 0 ? double(width()) / m_shown.PicPicSize.width : 1;
     const TextLabelBox& box = m_shown.LabeltextBox;
-    // A finger needs some room, however small the caption is.
+    // The box is large enough for a finger, however small the caption is.
     QRectF area(box.left * m_scale, box.top * m_scale, box.width * m_scale, box.height * m_scale);
     const QPointF middle = area.center();
     area.setSize({std::max(area.width(), 44.0), std::max(area.height(), 44.0)});
@@ -66,7 +66,7 @@ void EditorPaper::render() {
         m_caption->setGeometry(area.toRect());
     if (m_caption->isHidden() == m_shown.Labeltext.visible)
         m_caption->setVisible(m_shown.Labeltext.visible);
-    // The same bitmap draws the same: a change elsewhere on the page leaves the paper alone.
+    // The paper is repainted for another bitmap only.
     if (m_preview.cacheKey() != m_shown.PicPic.image().cacheKey() || m_shown.crop.visible) {
         m_preview = m_shown.PicPic.image();
         update();

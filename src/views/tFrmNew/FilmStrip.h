@@ -7,7 +7,7 @@
 namespace lumora {
 
 // One small picture of the strip below the editor: a tap opens it. The one in the editor is marked, and those that are
-// ordered wear a tick.
+// ordered have a tick.
 class StripCell : public CardButton {
     Q_OBJECT
 public:

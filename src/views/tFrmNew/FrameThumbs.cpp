@@ -74,7 +74,7 @@ public:
     }
 
 private:
-    // Kept by the bitmap that it was made of: a category that comes again need not be made again.
+    // Kept by its source bitmap, so that a category that is chosen again is not drawn again.
     const QImage& clear(int row) const {
         const Bitmap picture = m_picture(row);
         static const QImage none;

@@ -18,7 +18,7 @@ class FrameThumbs : public QListWidget {
 public:
     FrameThumbs(const Theme& theme, std::function<Bitmap(int)> picture, QWidget* parent);
 
-    // The row of the frame that the picture wears, -1 for none.
+    // The row of the frame on the picture, -1 for none.
     void setWorn(int row);
 
 Q_SIGNALS:

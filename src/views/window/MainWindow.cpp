@@ -161,7 +161,7 @@ void MainWindow::rebuild() {
     m_front = nullptr;
     m_below = nullptr;
     for (const auto& [page, view] : old) {
-        view->hide(); // before it lets go of its page: a button that is held down lets go too
+        view->hide(); // before it is detached, so that a held button is released
         view->detach();
         m_stack->removeWidget(view);
         view->deleteLater();

@@ -14,7 +14,7 @@ class MessagePanel : public Overlay {
 public:
     enum class Kind { Message, Question };
 
-    // The first button is the main one. Of a question the second is the no.
+    // The first button is the main one. The second button of a question means no.
     MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const QString& title, const QString& text,
                  const QStringList& buttons);
 

@@ -157,7 +157,7 @@ void PageView::renderBindings() {
             }
         } else if (auto* button = qobject_cast<QAbstractButton*>(widget)) {
             QString text = shownOnButton(caption.text);
-            if (!button->icon().isNull() && !text.isEmpty()) // some air between the sign and the word
+            if (!button->icon().isNull() && !text.isEmpty()) // space between the sign and the word
                 text = QChar(0xA0) + text + QChar(0xA0);
             if (button->text() != text)
                 button->setText(text);
@@ -263,7 +263,7 @@ void PageView::bindName(QWidget* widget, const Caption& caption) {
 
 QLineEdit* PageView::field(const Caption& caption, std::function<void(const QString&)> edited) {
     auto* made = new QLineEdit(this);
-    made->setProperty("ownRing", true); // its border tells
+    made->setProperty("ownRing", true); // its border shows the focus
     connect(made, &QLineEdit::textEdited, this, [edited = std::move(edited)](const QString& text) { edited(text); });
     bind(made, caption);
     return made;
@@ -335,7 +335,7 @@ void PageView::setDirectedIcon(QPushButton* button, Way way) {
     const bool right = (way == Way::Forwards) != (layoutDirection() == Qt::RightToLeft);
     const QString icon = right ? u"arrow-right"_s : u"arrow-left"_s;
     if (button->property("directedIcon") == icon)
-        return; // a button that is given its icon again paints itself again
+        return; // setting the same icon would repaint the button
     button->setProperty("directedIcon", icon);
     setIcon(button, icon, button->property("role") == u"main"_s ? QColor(Qt::white) : Theme::Colour::Ink);
 }

@@ -332,7 +332,7 @@ void PicturePicker::readNext() {
         m_reader.stop();
         return;
     }
-    // What is in view comes first.
+    // The rows in view are read first.
     auto next = m_unread.begin();
     const QRect seen = m_grid->viewport()->rect();
     for (auto at = m_unread.begin(); at != m_unread.end(); ++at) {
