@@ -36,6 +36,17 @@
 #include "views/window/MainWindow.h"
 
 namespace lumora {
+namespace {
+
+// A view is made for the page that its id stands for, so the page is of that class.
+template <class View, class P, class... More>
+MainWindow::ViewMaker viewOf(const SessionState& state, const More&... more) {
+    return [&state, &more...](Page& page, const Theme& theme) {
+        return std::make_unique<View>(static_cast<P&>(page), state, theme, more...);
+    };
+}
+
+} // namespace
 
 void registerPages(PageChain& chain, SessionState& state, const Platform& platform, const Deployment& deployment) {
     chain.registerPage(PageId::hatchala,
@@ -59,49 +70,22 @@ void registerPages(PageChain& chain, SessionState& state, const Platform& platfo
 }
 
 void registerViews(MainWindow& window, PageChain& chain, SessionState& state, const Files& files) {
-    // A view is made for the page that its id stands for, so the page is of that class.
-    window.registerView(PageId::hatchala, [&](Page& page, const Theme& theme) {
-        return std::make_unique<hatchalaView>(static_cast<hatchala&>(page), state, theme, files);
-    });
-    window.registerView(PageId::nnn, [&](Page& page, const Theme& theme) {
-        return std::make_unique<nnnView>(static_cast<nnn&>(page), state, theme);
-    });
-    window.registerView(PageId::Havharot, [&](Page& page, const Theme& theme) {
-        return std::make_unique<HavharotView>(static_cast<Havharot&>(page), state, theme);
-    });
-    window.registerView(PageId::kyoskNew, [&](Page& page, const Theme& theme) {
-        return std::make_unique<kyoskNewView>(static_cast<kyoskNew&>(page), state, theme);
-    });
-    window.registerView(PageId::mikledet, [&](Page& page, const Theme& theme) {
-        return std::make_unique<mikledetView>(static_cast<mikledet&>(page), state, theme);
-    });
-    window.registerView(PageId::B3, [&](Page& page, const Theme& theme) {
-        return std::make_unique<B3View>(static_cast<B3&>(page), state, theme);
-    });
+    window.registerView(PageId::hatchala, viewOf<hatchalaView, hatchala>(state, files));
+    window.registerView(PageId::nnn, viewOf<nnnView, nnn>(state));
+    window.registerView(PageId::Havharot, viewOf<HavharotView, Havharot>(state));
+    window.registerView(PageId::kyoskNew, viewOf<kyoskNewView, kyoskNew>(state));
+    window.registerView(PageId::mikledet, viewOf<mikledetView, mikledet>(state));
+    window.registerView(PageId::B3, viewOf<B3View, B3>(state));
     window.registerView(PageId::tFrmNew, [&](Page& page, const Theme& theme) {
         return std::make_unique<tFrmNewView>(static_cast<tFrmNew&>(page), chain, state, theme);
     });
-    window.registerView(PageId::Form2, [&](Page& page, const Theme& theme) {
-        return std::make_unique<Form2View>(static_cast<Form2&>(page), state, theme);
-    });
-    window.registerView(PageId::Form3, [&](Page& page, const Theme& theme) {
-        return std::make_unique<Form3View>(static_cast<Form3&>(page), state, theme);
-    });
-    window.registerView(PageId::RedI, [&](Page& page, const Theme& theme) {
-        return std::make_unique<RedIView>(static_cast<RedI&>(page), state, theme);
-    });
-    window.registerView(PageId::UploadForm, [&](Page& page, const Theme& theme) {
-        return std::make_unique<UploadFormView>(static_cast<UploadForm&>(page), state, theme);
-    });
-    window.registerView(PageId::FtpFrm, [&](Page& page, const Theme& theme) {
-        return std::make_unique<FtpFrmView>(static_cast<FtpFrm&>(page), state, theme, files);
-    });
-    window.registerView(PageId::MoogMeret, [&](Page& page, const Theme& theme) {
-        return std::make_unique<MoogMeretView>(static_cast<MoogMeret&>(page), state, theme);
-    });
-    window.registerView(PageId::SpltForm, [&](Page& page, const Theme& theme) {
-        return std::make_unique<SpltFormView>(static_cast<SpltForm&>(page), state, theme);
-    });
+    window.registerView(PageId::Form2, viewOf<Form2View, Form2>(state));
+    window.registerView(PageId::Form3, viewOf<Form3View, Form3>(state));
+    window.registerView(PageId::RedI, viewOf<RedIView, RedI>(state));
+    window.registerView(PageId::UploadForm, viewOf<UploadFormView, UploadForm>(state));
+    window.registerView(PageId::FtpFrm, viewOf<FtpFrmView, FtpFrm>(state, files));
+    window.registerView(PageId::MoogMeret, viewOf<MoogMeretView, MoogMeret>(state));
+    window.registerView(PageId::SpltForm, viewOf<SpltFormView, SpltForm>(state));
 }
 
 } // namespace lumora
