@@ -90,7 +90,7 @@ TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
     for (const QString& path : gone + kept)
         put(DrivePath(path));
     // A name outside the code page lists with a "?", under which there is no file.
-    const HostPath odd = *machine.drives.toHost(WorkspacePaths::ktanim(state)) / "\xE6\xBC\xA2.jpg";
+    const HostPath odd = *machine.drives.toHost(WorkspacePaths::ktanim(state)) / "!\xE6\xBC\xA2.jpg";
     std::ofstream(odd) << "x";
     ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_TRUE(std::filesystem::exists(odd));
