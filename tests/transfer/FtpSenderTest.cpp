@@ -182,7 +182,7 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
              line.lab.putFaults = {{u"01a.jpp"_s, 1, -1}};
          },
          Success, 2, 4},
-        // Each attempt reaches for the server five times for each file and five times for the check.
+        // The 60 tries end within the third attempt.
         {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
         {"cut, and the remains can't be deleted",
