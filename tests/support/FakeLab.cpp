@@ -107,7 +107,8 @@ public:
             listing.entries = {{u"."_s, true}, {u".."_s, true}};
         const QString prefix = m_here.isEmpty() ? QString() : m_here + u'/';
         for (const auto& [path, folder] : m_lab.folders) {
-            if (!path.isEmpty() && path.startsWith(prefix) && !path.mid(prefix.size()).contains(u'/'))
+            if (path.mid(prefix.size()) != m_lab.hiddenFolder && !path.isEmpty() && path.startsWith(prefix) &&
+                !path.mid(prefix.size()).contains(u'/'))
                 listing.entries.push_back({path.mid(prefix.size()), true});
         }
         for (const auto& [name, bytes] : m_lab.folders[m_here])

@@ -30,6 +30,7 @@ public:
     int refusedLogins = 0;             // wrong user or password
     int failedListings = 0;            // the line is cut while a listing comes
     bool refusesEmptyListings = false; // with 550
+    QString hiddenFolder;              // no listing names it
     QString unreadLine;                // stands in each listing of an order's folder
     bool refusesDelete = false;
     bool refusesFolders = false; // no folder can be made

@@ -1,4 +1,5 @@
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
 #include "support/FakeLab.h"
@@ -29,6 +30,14 @@ struct Guarded {
                   OrderLog::of(rig.state, OrderLog::Layout::Plain, items, failed, rig.test.clock.time).write());
     }
     void remove(const QString& leaf) { EXPECT_TRUE(rig.test.files.removeFile(FtpFrmRig::local(leaf))); }
+    // The state that an earlier run left; with a basket the order was never sent.
+    void keep(const QStringList& basket, bool folderMadeByUs) {
+        OrderJournal journal(rig.test.files, OrderFolder(FtpFrmRig::folder()));
+        EXPECT_TRUE(journal.begin(rig.state, OrderState::Way::Ftp, basket));
+        EXPECT_TRUE(journal.prepared());
+        if (folderMadeByUs)
+            EXPECT_TRUE(journal.sendingBegins(Sender::Ftp, true));
+    }
     OrderState kept() const {
         const Result<OrderState> state = ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()));
         return state ? *state : OrderState();
@@ -194,6 +203,94 @@ TEST(FtpGuards, APassThatStandsStillEndsAndItsFileIsBroken) {
         order.rig.page().Command10_Click();
         EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
         EXPECT_EQ(order.remote()[FtpFrmRig::first()], order.rig.localFiles()[FtpFrmRig::first()]);
+    }
+}
+
+// The folder on the server bears the order's name: whose is it?
+TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
+    using Phase = OrderState::Phase;
+    const QByteArray otherLog = "\"00\",\"00\"\r\n\"Shemot.n1\",\"Someone else\"\r\n";
+    struct Case {
+        const char* what;
+        std::function<void(Guarded&)> arrange;
+        bool ours;
+    };
+    const Case cases[] = {
+        {"nothing there", [](Guarded& order) { order.lab.folders.erase(FtpFrmRig::remoteFolder()); }, true},
+        {"an empty folder", [](Guarded&) {}, true},
+        {"an empty folder, whose listing is refused", [](Guarded& order) { order.lab.refusesEmptyListings = true; },
+         true},
+        {"its own log",
+         [](Guarded& order) {
+             order.remote() = {{FtpFrmRig::log(), order.rig.localFiles()[FtpFrmRig::log()]}, {u"x.jpp"_s, "x"}};
+         },
+         true},
+        {"another log",
+         [&](Guarded& order) {
+             order.remote() = {{FtpFrmRig::log(), otherLog}};
+         },
+         false},
+        {"half of its log",
+         [](Guarded& order) {
+             order.remote() = {{FtpFrmRig::log(), order.rig.localFiles()[FtpFrmRig::log()].chopped(1)}};
+         },
+         false},
+        {"names, and no log",
+         [](Guarded& order) {
+             order.remote() = {{FtpFrmRig::first(), "another's"}};
+         },
+         false},
+        {"made by this order",
+         [](Guarded& order) {
+             order.remote() = {{FtpFrmRig::first(), "of an earlier try"}};
+             order.keep({}, true);
+         },
+         true},
+        {"another log, and no listing names the folder",
+         [&](Guarded& order) {
+             order.remote() = {{FtpFrmRig::log(), otherLog}};
+             order.lab.hiddenFolder = FtpFrmRig::name();
+         },
+         false},
+    };
+    for (const Case& each : cases) {
+        for (const bool careful : {true, false}) {
+            for (const bool basketKept : {true, false}) {
+                SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : "") +
+                             (basketKept ? ", basket kept" : ""));
+                Guarded order(careful);
+                order.rig.chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+                order.remote();
+                if (basketKept)
+                    order.keep({u"021015GNBC:\\pics\\aabb.jpg"_s}, false);
+                each.arrange(order);
+                const FakeLab::Folder before = order.remote();
+                // On the server the next number is another's too.
+                order.lab.folders[u"zalamim234/2026_11_21_KUP_1234^106"_s];
+                order.rig.send();
+                const bool sends = each.ours || !careful;
+                EXPECT_EQ(order.lab.puts.isEmpty(), !sends);
+                EXPECT_FALSE(order.rig.test.files.fileExists(FtpFrmRig::local(u".log-there"_s)));
+                if (sends) {
+                    EXPECT_GE(order.kept().phase, Phase::Sending);
+                    continue;
+                }
+                EXPECT_EQ(order.remote(), before);
+                if (!basketKept) {
+                    EXPECT_EQ(order.rig.page().phase(), SendingPhase::CallLab);
+                    EXPECT_EQ(order.rig.page().controls().Label34.text, QString()) << "the first attempt alone";
+                    EXPECT_TRUE(order.rig.page().controls().Label4Reason.text.contains(u"הזמנה אחרת"_s));
+                    continue;
+                }
+                EXPECT_EQ(order.rig.chain.front()->id(), PageId::Form2);
+                EXPECT_EQ(order.rig.state.MisparHazmana, u"107"_s);
+                EXPECT_EQ(order.rig.state.handOver.lines.size(), 1);
+                EXPECT_TRUE(order.rig.state.handOver.pressStart);
+                EXPECT_EQ(order.rig.state.handOver.replaced, FtpFrmRig::folder());
+                EXPECT_EQ(order.rig.test.dialogs.messages.size(), 1);
+                EXPECT_TRUE(order.rig.test.dialogs.messages.value(0).contains(u"105"_s));
+            }
+        }
     }
 }
 

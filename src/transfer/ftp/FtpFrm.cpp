@@ -148,6 +148,10 @@ void FtpFrm::sendOrder() {
         m_sender.session.closeSession();
         return;
     }
+    if (*end == SendingPhase::NumberTaken) {
+        prepareAgain();
+        return;
+    }
     if (*end == SendingPhase::NotAll)
         showFailure();
     finish(*end);

@@ -128,6 +128,7 @@ private:
     void showCounts();
     void showAttempt(int attempt);
     void showStoppedBoxes();
+    void showNumberTaken(const QString& number);
     void showNoServerBoxes();
 
     // FtpFrmEvents.cpp

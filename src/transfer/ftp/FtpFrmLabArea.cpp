@@ -38,7 +38,10 @@ void FtpFrm::sendInRounds() {
         m_platform.dialogs.message(u"list3 is empty"_s);
         return;
     }
-    if (const auto end = m_sender.runOlderRounds())
+    const std::optional<SendingPhase> end = m_sender.runOlderRounds();
+    if (end == SendingPhase::NumberTaken)
+        prepareAgain();
+    else if (end)
         finish(*end);
 }
 

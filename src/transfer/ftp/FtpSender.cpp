@@ -114,7 +114,7 @@ private:
 };
 
 FtpSender::FtpSender(SessionState& state, const Platform& platform, SendingEvents& events)
-    : session(state.profile, state.transfer, platform, events, stop, lists)
+    : session(state, platform, events, stop, lists)
     , pass(state, platform, events, stop, lists, session)
     , check(state.transfer, platform.pump, events, stop, lists, session)
     , m_platform(platform)

@@ -36,17 +36,19 @@ bool CheckFtpSettings(const ClientProfile& profile) {
     return SenderSetUp(profile, Sender::Ftp);
 }
 
-FtpSession::FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform,
-                       SendingEvents& events, SendingStop& stop, FtpLists& lists)
-    : m_profile(profile)
-    , m_transfer(transfer)
+FtpSession::FtpSession(SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
+                       FtpLists& lists)
+    : m_profile(state.profile)
+    , m_transfer(state.transfer)
     , m_platform(platform)
     , m_events(events)
     , m_stop(stop)
-    , m_lists(lists) {}
+    , m_lists(lists)
+    , m_folderOwner(state, platform.files) {}
 
 void FtpSession::beginOrder() {
     m_putBegun = false;
+    m_owner = FtpFolderOwner::Owner::NotKnown;
     m_journal.emplace(m_platform.files, OrderFolder(m_transfer.OrderFolder));
 }
 
@@ -213,10 +215,31 @@ bool FtpSession::enterListedFolder(const QString& name) {
     }
     // Once a put was tried, a refused listing may hide what it left.
     listHere(m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused);
-    if (!bActiveSession)
+    if (!bActiveSession || !mayJoin(name))
         return false;
     FillListFromNames(Target::List6, name);
     m_inOrderFolder = true;
+    return true;
+}
+
+// Asked once an order; a folder of another order of a chain is only looked at.
+bool FtpSession::mayJoin(const QString& name) {
+    using Owner = FtpFolderOwner::Owner;
+    if (!m_journal || m_journal->folder().name() != name || m_owner == Owner::Ours)
+        return true;
+    m_owner = m_folderOwner.of(*m_journal, *hConnection, m_listing);
+    if (m_owner == Owner::NotKnown && !m_listing.unread.isEmpty())
+        trouble(LineStep::List, {Failure::Kind::Damaged, m_listing.unread});
+    return m_owner == Owner::Ours || m_owner == Owner::NotAsked;
+}
+
+bool FtpSession::joinOrderFolder(const QString& name) {
+    if (!enterListedFolder(name))
+        return false;
+    keep(m_journal->sendingBegins(Sender::Ftp, m_owner == FtpFolderOwner::Owner::Ours));
+    tell(SendingMoment::Continuing);
+    pump();
+    tell(SendingMoment::Ready);
     return true;
 }
 
@@ -228,25 +251,23 @@ bool FtpSession::EnterOrderFolder() {
     }
     QString& name = m_transfer.ShemTikiya;
     name = OrderFolder(m_transfer.OrderFolder).name();
-    if (m_lists.List5.contains(name)) {
-        if (!enterListedFolder(name))
-            return false;
-        keep(m_journal->sendingBegins(Sender::Ftp, false));
-        tell(SendingMoment::Continuing);
-        pump();
-        tell(SendingMoment::Ready);
-        return true;
-    }
+    if (m_lists.List5.contains(name))
+        return joinOrderFolder(name);
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
     const bool made = FtpMakeOrderDir(name);
-    if (made)
+    if (made) {
+        m_owner = FtpFolderOwner::Owner::Ours;
         keep(m_journal->sendingBegins(Sender::Ftp, true));
+    }
     pump();
     if (!bActiveSession || !hConnection) {
         log(u"after MakeRemoteDir"_s);
         return false;
     }
+    // It may be there, though the listing above did not name it.
+    if (!made && m_folderOwner.asks())
+        return joinOrderFolder(name);
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
         trouble(LineStep::OrderFolder, entered.failure());
@@ -321,7 +342,7 @@ void FtpSession::remove(const QString& remoteName) {
 }
 
 void FtpSession::ClearListing() {
-    m_unreadLine.clear();
+    m_listing = {};
     colNames.clear();
     colAttrs.clear();
 }
@@ -333,7 +354,7 @@ Result<FtpListing> FtpSession::find(EmptyFolder empty) {
 }
 
 void FtpSession::take(const FtpListing& listing) {
-    m_unreadLine = listing.unread;
+    m_listing = listing;
     for (const FtpEntry& entry : listing.entries) {
         colNames.append(entry.name);
         colAttrs.push_back(entry.folder ? folderAttribute : plainAttribute);

@@ -5,6 +5,7 @@
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/Attempts.h"
+#include "transfer/ftp/FtpFolderOwner.h"
 #include "transfer/ftp/FtpLists.h"
 
 #include <QStringList>
@@ -23,8 +24,8 @@ struct Platform;
 // once for each file and once for each check, so that a broken connection costs at most the present file.
 class FtpSession {
 public:
-    FtpSession(const ClientProfile& profile, TransferState& transfer, const Platform& platform, SendingEvents& events,
-               SendingStop& stop, FtpLists& lists);
+    FtpSession(SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
+               FtpLists& lists);
 
     // The order of OrderFolder begins: nothing of it has been put. Reads its state.
     void beginOrder();
@@ -49,9 +50,12 @@ public:
     bool insideOrderBase() const;
     // Enters the order's folder and makes it if it is missing. False on failure: nothing may be put then.
     bool EnterOrderFolder();
-    // Enters an order's folder that List5 names and reads its names into List6. False on failure, with List6 unchanged.
+    // Enters an order's folder that the server has and reads its names into List6. False on failure and where the
+    // folder is another order's, with List6 unchanged.
     bool enterListedFolder(const QString& name);
     bool inOrderFolder() const { return m_inOrderFolder; }
+    // The folder under this order's name belongs to another order: nothing may be put.
+    bool folderIsForeign() const { return m_owner == FtpFolderOwner::Owner::Foreign; }
     bool FtpMakeOrderDir(const QString& name);
 
     // Puts one file, whose name stands in the order's state until the put is confirmed. A failed put is added to
@@ -68,7 +72,7 @@ public:
     void ListRemoteHere();
     void ListRemoteChecked();
     // The first line of the last listing that could not be read; the listing proves nothing then.
-    const QString& unreadLine() const { return m_unreadLine; }
+    const QString& unreadLine() const { return m_listing.unread; }
     enum class Target { List1, List2, List4, List5, List6 };
     void FillListFromNames(Target target, const QString& dir);
 
@@ -115,6 +119,8 @@ private:
     void ClearListing();
     Result<FtpListing> find(EmptyFolder empty = EmptyFolder::IsListed);
     void listHere(EmptyFolder empty);
+    bool joinOrderFolder(const QString& name);
+    bool mayJoin(const QString& name);
     void take(const FtpListing& listing);
     void FtpFatalError(const Failure& failure, const QString& source);
     void listHereAgain();
@@ -126,9 +132,11 @@ private:
     SendingStop& m_stop;
     FtpLists& m_lists;
     std::optional<OrderJournal> m_journal;
+    FtpFolderOwner m_folderOwner;
+    FtpFolderOwner::Owner m_owner = FtpFolderOwner::Owner::NotKnown; // of the order's folder, until it is known
+    FtpListing m_listing;                                            // that was read last
     bool m_inOrderFolder = false;
     bool m_putBegun = false; // a put of this order has been tried, so its folder may hold something
-    QString m_unreadLine;
     // Each file of a pass opens a session; these failures are told once a pass.
     bool m_noInternetTold = false;
     bool m_noSessionTold = false;

@@ -47,7 +47,8 @@ bool UploadPass::endEarly() {
         return false;
     m_session.closeSession();
     m_stop.StopFlag = false;
-    m_events.failed(LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
+    if (m_end != SendingPhase::NumberTaken)
+        m_events.failed(m_endStep, m_endFailure);
     return true;
 }
 
@@ -62,9 +63,15 @@ void UploadPass::watch() {
 }
 
 // By the way of a stop, which ends whatever is under way.
-void UploadPass::endSilent() {
-    m_end = SendingPhase::NotAll;
+void UploadPass::endBy(SendingPhase end, LineStep step, const Failure& why) {
+    m_end = end;
+    m_endStep = step;
+    m_endFailure = why;
     m_stop.StopFlag = true;
+}
+
+void UploadPass::endSilent() {
+    endBy(SendingPhase::NotAll, LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
 }
 
 void UploadPass::endStopped() {
@@ -114,6 +121,11 @@ void UploadPass::UploadOneFile(int index) {
     m_events.reached(SendingMoment::WalkDone);
     if (m_stop.left)
         return;
+    if (m_session.folderIsForeign() && !m_stop.StopFlag) {
+        const bool basketKept = !m_session.journal()->state().items.isEmpty();
+        endBy(basketKept ? SendingPhase::NumberTaken : SendingPhase::CallLab, LineStep::ForeignFolder,
+              {Failure::Kind::InUse, u"the folder on the server holds another order"_s});
+    }
     if (m_stop.StopFlag) {
         m_session.FtpCloseConnection();
         return;

@@ -40,6 +40,7 @@ public:
     bool FaultPressed = false; // no page reads it
 
 private:
+    void endBy(SendingPhase end, LineStep step, const Failure& why);
     void endSilent();
     void tellPiece(int index);
     void send(const QString& path);
@@ -53,6 +54,8 @@ private:
     FtpSession& m_session;
     SilenceLimit m_silence;
     std::optional<SendingPhase> m_end;
+    LineStep m_endStep = LineStep::Silence; // and why; not told where the page leads on by itself
+    Failure m_endFailure;
     bool m_running = false;
     qint64 m_skipped = 0; // bytes of the files that the server has, of this pass
 };

@@ -1,0 +1,136 @@
+#include "transfer/ftp/FtpArrival.h"
+
+#include "common/DrivePath.h"
+#include "order/LineEnds.h"
+#include "platform/files/Files.h"
+#include "platform/line/Internet.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// Behind so many names without an answer a server is not asked again.
+constexpr int mostUnanswered = 3;
+
+bool isShared(const QString& name) {
+    return name == u"000.jpg"_s;
+}
+
+// Where a name comes twice, the longest length is believed.
+const RemoteFile* entryOf(const QList<RemoteFile>& there, const QString& name) {
+    const RemoteFile* found = nullptr;
+    for (const RemoteFile& entry : there) {
+        if (entry.name == name && (!found || entry.length > found->length))
+            found = &entry;
+    }
+    return found;
+}
+
+} // namespace
+
+void FtpArrival::beginOrder() {
+    m_unanswered = 0;
+    m_firstLooked = false;
+    m_lengths.clear();
+}
+
+bool FtpArrival::decides() const {
+    return m_state.Careful;
+}
+
+std::optional<qint64> FtpArrival::ask(FtpConnection& connection, const QString& name) {
+    if (m_unanswered >= mostUnanswered)
+        return std::nullopt;
+    const Result<std::optional<qint64>> told = connection.length(name);
+    const std::optional<qint64> length = told ? *told : std::nullopt;
+    if (told)
+        m_unanswered = length ? 0 : m_unanswered + 1;
+    return length;
+}
+
+// SIZE is asked where the listing does not already tell the length of the file here, and is believed before it.
+std::optional<FtpArrival::Found> FtpArrival::lengthsOf(FtpConnection& connection, const QString& path,
+                                                       const QList<RemoteFile>& there) {
+    const QString name = LeafName(path);
+    const RemoteFile* entry = entryOf(there, name);
+    const Result<qint64> here = m_files.size(DrivePath(path));
+    if (!entry || !here)
+        return std::nullopt;
+    Found found{*here, entry->length};
+    if (found.there != *here && !isShared(name)) {
+        if (const std::optional<qint64> asked = ask(connection, name))
+            found.there = asked;
+    }
+    return found;
+}
+
+bool FtpArrival::isOther(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there) {
+    if (!decides() || isShared(LeafName(path)))
+        return false;
+    const std::optional<Found> found = lengthsOf(connection, path, there);
+    return found && found->there && *found->there != found->here;
+}
+
+bool FtpArrival::isWhole(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there) {
+    if (!decides() || isShared(LeafName(path)))
+        return false;
+    const std::optional<Found> found = lengthsOf(connection, path, there);
+    return found && found->there == found->here;
+}
+
+std::optional<ArrivalProof> FtpArrival::proofOf(FtpConnection& connection, const QStringList& paths,
+                                                const QList<RemoteFile>& there) {
+    if (!decides())
+        return std::nullopt;
+    QList<LocalFile> here;
+    m_lengths.clear();
+    for (const QString& path : paths) {
+        const QString name = LeafName(path);
+        const Result<qint64> length = m_files.size(DrivePath(path));
+        here += {name, length ? *length : -1}; // a file that is gone here proves nothing by its length
+        if (const std::optional<Found> found = lengthsOf(connection, path, there))
+            m_lengths += {name, found->there};
+        else if (const RemoteFile* entry = entryOf(there, name))
+            m_lengths += *entry;
+    }
+    return ArrivalProof::of(here, m_lengths, ArrivalProof::Names::Exact);
+}
+
+bool FtpArrival::explains(const QString& path, qint64 there) const {
+    const DrivePath file(path);
+    const Result<qint64> here = m_files.size(file);
+    const Result<LineEnds> ends = LineEndsOf(m_files, file);
+    return here && ends && ends->explain(*here, there);
+}
+
+bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path) {
+    const QString name = LeafName(path);
+    if (!decides() || m_firstLooked || isShared(name))
+        return false;
+    m_firstLooked = true;
+    std::optional<qint64> length = ask(connection, name);
+    if (!length) {
+        const Result<FtpListing> listing = connection.list(u"*.*"_s);
+        for (const FtpEntry& entry : listing ? listing->entries : std::vector<FtpEntry>()) {
+            if (entry.name == name)
+                length = entry.length;
+        }
+    }
+    return length && explains(path, *length);
+}
+
+bool FtpArrival::lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const {
+    return !proof.broken.isEmpty() && std::all_of(proof.broken.begin(), proof.broken.end(), [&](const QString& name) {
+        const RemoteFile* entry = entryOf(m_lengths, name);
+        const auto path = std::find_if(paths.begin(), paths.end(),
+                                       [&](const QString& each) { return LeafName(each) == name; });
+        return entry && entry->length && path != paths.end() && explains(*path, *entry->length);
+    });
+}
+
+} // namespace lumora

@@ -1,0 +1,39 @@
+#pragma once
+
+namespace lumora {
+
+class Files;
+class FtpConnection;
+class OrderJournal;
+struct FtpListing;
+struct SessionState;
+
+// Whose order the folder on the server is that bears an order's name: two data folders with one serial make one name.
+// As built in, whatever is there counts as the order's own.
+class FtpFolderOwner {
+public:
+    enum class Owner {
+        NotAsked, // as built in
+        Ours,     // made by this order, or empty, or with this order's log in it, byte for byte
+        Foreign,
+        NotKnown, // the listing could not be read, or the line was cut
+    };
+
+    FtpFolderOwner(const SessionState& state, const Files& files)
+        : m_state(state)
+        , m_files(files) {}
+
+    // True when the owner is asked for; a folder is then never joined without its listing.
+    bool asks() const;
+    // The connection stands in the folder, whose listing this is. Fetches the log into a hidden file beside the order's
+    // own, which is removed.
+    Owner of(const OrderJournal& order, FtpConnection& connection, const FtpListing& listing) const;
+
+private:
+    Owner byLog(const OrderJournal& order, FtpConnection& connection) const;
+
+    const SessionState& m_state;
+    const Files& m_files;
+};
+
+} // namespace lumora
