@@ -74,7 +74,9 @@ public:
             m_cut = true;
             return cut();
         }
-        m_lab.folders[m_here][remoteName] = content;
+        const std::optional<QByteArray> stored = m_lab.stores ? m_lab.stores(remoteName, content) : content;
+        if (stored)
+            m_lab.folders[m_here][remoteName] = *stored;
         return {};
     }
 
@@ -112,7 +114,8 @@ public:
                 listing.entries.push_back({path.mid(prefix.size()), true});
         }
         for (const auto& [name, bytes] : m_lab.folders[m_here])
-            listing.entries.push_back({name, false, bytes.size()});
+            listing.entries.push_back(
+                {name, false, m_lab.listsLengths ? std::optional<qint64>(bytes.size()) : std::nullopt});
         if (listing.entries.empty() && m_lab.refusesEmptyListings && empty == EmptyFolder::IsListed)
             return no(u"550 No files found."_s).failure();
         if (m_here.contains(u'^'))
@@ -123,8 +126,10 @@ public:
     Result<std::optional<qint64>> length(const QString& remoteName) override {
         if (isCut())
             return cut();
+        ++m_lab.sizesAsked;
         const FakeLab::Folder& folder = m_lab.folders[m_here];
-        return folder.contains(remoteName) ? std::optional<qint64>(folder.at(remoteName).size()) : std::nullopt;
+        return m_lab.tellsSize && folder.contains(remoteName) ? std::optional<qint64>(folder.at(remoteName).size())
+                                                              : std::nullopt;
     }
 
     QString lastResponse() const override { return m_response; }

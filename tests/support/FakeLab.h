@@ -45,6 +45,11 @@ public:
     };
     std::vector<PutFault> putFaults;
 
+    // What a put that is answered well stores of its content; no value: nothing.
+    std::function<std::optional<QByteArray>(const QString& name, const QByteArray& content)> stores;
+    bool listsLengths = true;
+    bool tellsSize = true;
+
     // Runs as a put begins, as something that happens meanwhile.
     std::function<void(const QString& name)> onPut;
     // Runs as a connection is asked for; the number counts from 1.
@@ -53,6 +58,7 @@ public:
     // What the server saw.
     QStringList puts; // names, also of puts that failed
     int connects = 0;
+    int sizesAsked = 0;
     int aborts = 0;   // each cuts the connections that stand then
     QStringList urls; // in order, as the client gave them
 

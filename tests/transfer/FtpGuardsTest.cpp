@@ -35,8 +35,9 @@ struct Guarded {
         OrderJournal journal(rig.test.files, OrderFolder(FtpFrmRig::folder()));
         EXPECT_TRUE(journal.begin(rig.state, OrderState::Way::Ftp, basket));
         EXPECT_TRUE(journal.prepared());
-        if (folderMadeByUs)
+        if (folderMadeByUs) {
             EXPECT_TRUE(journal.sendingBegins(Sender::Ftp, true));
+        }
     }
     OrderState kept() const {
         const Result<OrderState> state = ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()));
@@ -290,6 +291,158 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
                 EXPECT_EQ(order.rig.test.dialogs.messages.size(), 1);
                 EXPECT_TRUE(order.rig.test.dialogs.messages.value(0).contains(u"105"_s));
             }
+        }
+    }
+}
+
+// Each put is answered well; what the server has stored is another matter.
+TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
+    using Phase = OrderState::Phase;
+    using Content = std::optional<QByteArray>;
+    struct Case {
+        const char* what;
+        std::function<void(Guarded&)> arrange;
+        SendingPhase end; // with the guards
+        int putsMore;     // than the order has files
+        bool reported;
+        bool byNameOnly;
+        SendingPhase builtIn;
+    };
+    const auto onFirst = [](int times, const std::function<Content(const QByteArray&)>& change) {
+        return [=](Guarded& order) {
+            order.lab.stores = [=](const QString& name, const QByteArray& content) mutable -> Content {
+                return name == FtpFrmRig::first() && times-- > 0 ? change(content) : Content(content);
+            };
+        };
+    };
+    const auto each = [](const std::function<QByteArray(QByteArray)>& change) {
+        return [=](Guarded& order) {
+            order.lab.stores = [=](const QString&, const QByteArray& content) { return Content(change(content)); };
+        };
+    };
+    const auto half = [](const QByteArray& content) { return Content(content.left(content.size() / 2)); };
+    const auto part = [](Guarded& order) {
+        order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::second()});
+        order.rig.test.dialogs.answers = {true};
+    };
+    using enum SendingPhase;
+    const Case cases[] = {
+        {"whole", [](Guarded&) {}, Success, 0, true, false, Success},
+        {"half of a file, once", onFirst(1, half), Success, 1, true, false, Success},
+        {"half of a file, always", onFirst(99, half), NotAll, 3, false, false, Success},
+        {"an empty file", onFirst(1, [](const QByteArray&) { return Content(QByteArray()); }), Success, 1, true, false,
+         Success},
+        {"the last byte is missing", onFirst(1, [](const QByteArray& content) { return Content(content.chopped(1)); }),
+         Success, 1, true, false, Success},
+        {"a byte too many", onFirst(1, [](const QByteArray& content) { return Content(content + 'x'); }), Success, 1,
+         true, false, Success},
+        {"half of a file, and no SIZE",
+         [&](Guarded& order) {
+             onFirst(1, half)(order);
+             order.lab.tellsSize = false;
+         },
+         Success, 1, true, false, Success},
+        {"half of a file, and the listing tells no lengths",
+         [&](Guarded& order) {
+             onFirst(1, half)(order);
+             order.lab.listsLengths = false;
+         },
+         Success, 1, true, false, Success},
+        {"half of a file, and nothing tells lengths",
+         [&](Guarded& order) {
+             onFirst(1, half)(order);
+             order.lab.listsLengths = order.lab.tellsSize = false;
+         },
+         Success, 0, true, true, Success},
+        {"the file is gone, and a stranger there",
+         [&](Guarded& order) {
+             onFirst(1, [](const QByteArray&) { return Content(); })(order);
+             order.remote()[u"Thumbs.db"_s] = "x";
+             order.keep({}, true);
+         },
+         Success, 1, true, false, Success},
+        {"strangers beside it",
+         [](Guarded& order) {
+             order.remote()[u"Thumbs.db"_s] = "x";
+             order.keep({}, true);
+         },
+         Success, 0, true, false, AllThere},
+        {"another file of the same name",
+         [](Guarded& order) {
+             order.remote()[FtpFrmRig::second()] = "x";
+             order.keep({}, true);
+         },
+         Success, 0, true, false, Success},
+        {"CR dropped", each([](QByteArray content) { return content.replace("\r", ""); }), CallLab, -4, false, false,
+         Success},
+        {"CR LF to LF", each([](QByteArray content) { return content.replace("\r\n", "\n"); }), CallLab, -4, false,
+         false, Success},
+        {"LF to CR LF", each([](QByteArray content) { return content.replace("\n", "\r\n"); }), CallLab, -4, false,
+         false, Success},
+        {"bare LF to CR LF in the pictures alone",
+         onFirst(99,
+                 [](QByteArray content) {
+                     return Content(content.replace("\r\n", "\1").replace("\n", "\r\n").replace("\1", "\r\n"));
+                 }),
+         CallLab, 0, false, false, Success},
+        {"a chosen part of an order that is not there", part, AllThere, -2, false, false, Success},
+        {"a chosen part that makes the order whole",
+         [&](Guarded& order) {
+             part(order);
+             for (const QString& name : {FtpFrmRig::first(), FtpFrmRig::sheet()})
+                 order.remote()[name] = order.rig.localFiles()[name];
+             order.keep({}, true);
+         },
+         Success, -2, true, false, AllThere},
+        {"a line of the listing can't be read", [](Guarded& order) { order.lab.unreadLine = u"?"_s; }, Unclear, 0,
+         false, false, NotAll},
+    };
+    for (const Case& one : cases) {
+        for (const bool careful : {true, false}) {
+            SCOPED_TRACE(std::string(one.what) + (careful ? ", careful" : ""));
+            Guarded order(careful);
+            one.arrange(order);
+            order.rig.send();
+            EXPECT_EQ(order.rig.page().phase(), careful ? one.end : one.builtIn);
+            if (!careful)
+                continue;
+            EXPECT_EQ(order.lab.puts.size(), FtpFrmRig::names().size() + one.putsMore);
+            EXPECT_EQ(order.lab.urls.size(), one.reported ? 3 : 0);
+            EXPECT_TRUE(one.end != Success || one.putsMore > 0 || order.rig.page().controls().Label34.text.isEmpty())
+                << "the first attempt alone";
+            EXPECT_EQ(order.kept().phase == Phase::Reported, one.reported);
+            EXPECT_EQ(order.kept().provenByNameOnly, one.byNameOnly);
+            EXPECT_LE(order.lab.sizesAsked, 30);
+            if (one.end == Success && !one.byNameOnly) {
+                for (const auto& [name, bytes] : order.rig.localFiles()) {
+                    EXPECT_TRUE(name == u"kashloo.txt"_s || order.remote()[name] == bytes) << name.toStdString();
+                }
+            }
+            if (one.end == CallLab) {
+                EXPECT_TRUE(order.rig.page().lists().LogList.items().last().contains(u"Type = I"_s));
+                EXPECT_TRUE(order.rig.page().controls().Label4Reason.text.contains(u"משנה את הקבצים"_s));
+                EXPECT_EQ(order.rig.page().controls().Label34.text, QString()) << "the first attempt alone";
+            }
+        }
+    }
+}
+
+// Killed behind the last byte of a put and before its confirmation.
+TEST(FtpGuards, AFileInHandThatLiesThereWholeIsNotSentTwice) {
+    for (const bool careful : {true, false}) {
+        for (const bool whole : {true, false}) {
+            Guarded order(careful);
+            order.keep({}, true);
+            const QString path = FtpFrmRig::local(FtpFrmRig::first()).text();
+            ASSERT_TRUE(OrderJournal(order.rig.test.files, OrderFolder(FtpFrmRig::folder())).take(path));
+            const QByteArray bytes = order.rig.localFiles()[FtpFrmRig::first()];
+            order.remote()[FtpFrmRig::first()] = whole ? bytes : bytes.left(60);
+            order.rig.send();
+            EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
+            EXPECT_EQ(order.lab.puts.contains(FtpFrmRig::first()), !(careful && whole));
+            EXPECT_EQ(order.rig.page().controls().Label34.text, QString()) << "the first attempt alone";
+            EXPECT_EQ(order.remote()[FtpFrmRig::first()], bytes);
+            EXPECT_TRUE(order.kept().filesInHand.isEmpty());
         }
     }
 }

@@ -48,6 +48,7 @@ std::optional<qint64> FtpArrival::ask(FtpConnection& connection, const QString& 
         return std::nullopt;
     const Result<std::optional<qint64>> told = connection.length(name);
     const std::optional<qint64> length = told ? *told : std::nullopt;
+    m_cut = m_cut || !told;
     if (told)
         m_unanswered = length ? 0 : m_unanswered + 1;
     return length;
@@ -89,6 +90,7 @@ std::optional<ArrivalProof> FtpArrival::proofOf(FtpConnection& connection, const
         return std::nullopt;
     QList<LocalFile> here;
     m_lengths.clear();
+    m_cut = false;
     for (const QString& path : paths) {
         const QString name = LeafName(path);
         const Result<qint64> length = m_files.size(DrivePath(path));
@@ -98,6 +100,8 @@ std::optional<ArrivalProof> FtpArrival::proofOf(FtpConnection& connection, const
         else if (const RemoteFile* entry = entryOf(there, name))
             m_lengths += *entry;
     }
+    if (m_cut)
+        return std::nullopt;
     return ArrivalProof::of(here, m_lengths, ArrivalProof::Names::Exact);
 }
 
@@ -127,8 +131,8 @@ bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path)
 bool FtpArrival::lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const {
     return !proof.broken.isEmpty() && std::all_of(proof.broken.begin(), proof.broken.end(), [&](const QString& name) {
         const RemoteFile* entry = entryOf(m_lengths, name);
-        const auto path = std::find_if(paths.begin(), paths.end(),
-                                       [&](const QString& each) { return LeafName(each) == name; });
+        const auto path =
+            std::find_if(paths.begin(), paths.end(), [&](const QString& each) { return LeafName(each) == name; });
         return entry && entry->length && path != paths.end() && explains(*path, *entry->length);
     });
 }

@@ -29,7 +29,7 @@ public:
     bool isOther(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there);
     // A file that is proven to lie there by its length.
     bool isWhole(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there);
-    // Of the files of a sending: full local paths. No value as built in.
+    // Of the files of a sending: full local paths. No value as built in, and where the line was cut meanwhile.
     std::optional<ArrivalProof> proofOf(FtpConnection& connection, const QStringList& paths,
                                         const QList<RemoteFile>& there);
     // Behind a put that was answered well: true where the server has stored it with other line ends. Asked for the
@@ -49,6 +49,7 @@ private:
 
     const SessionState& m_state;
     const Files& m_files;
+    bool m_cut = false;   // the line, while SIZE was asked
     int m_unanswered = 0; // names in a row for which SIZE told no length
     bool m_firstLooked = false;
     QList<RemoteFile> m_lengths; // of the last proof

@@ -53,9 +53,9 @@ void FtpFrm::watchLine() {
 
 void FtpFrm::keepArrival(SendingPhase end) {
     OrderJournal* journal = m_sender.session.journal();
-    if (!journal || !hasArrived(end))
+    if (!journal || !m_sender.orderArrived(end))
         return;
-    m_sender.session.keep(journal->arrived(true));
+    m_sender.session.keep(journal->arrived(m_sender.provenByNameOnly()));
     if (end == SendingPhase::AllThere)
         m_sender.session.keep(journal->needsNoReport());
 }

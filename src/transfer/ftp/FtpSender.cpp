@@ -30,16 +30,18 @@ private:
             }
         }
         compare(attempt);
-        const bool arrived = m_sender.allCounted();
+        const Verdict verdict = m_sender.verdict();
         // After a stop the count is valid only if this check has read the server's folder itself.
-        if (m_stop.StopFlag && !(arrived && m_sender.check.freshCount)) {
+        if (m_stop.StopFlag && !(verdict == Verdict::All && m_sender.check.freshCount)) {
             if (!m_stop.left)
                 m_sender.pass.endStopped();
             return SendingPhase::Stopped;
         }
-        if (arrived)
-            return SendingPhase::Success;
-        if (m_sender.check.NumOnServer > m_sender.NumToSend)
+        if (verdict == Verdict::All)
+            return m_sender.arrivedEnd();
+        if (verdict == Verdict::ServerChanges)
+            return m_sender.changedEnd();
+        if (verdict == Verdict::NotKnown)
             return std::nullopt;
         if (m_sender.lists.List3.isEmpty())
             return m_sender.silentEnd();
@@ -47,19 +49,19 @@ private:
         return std::nullopt;
     }
 
-    // Leaves the missing files in List3, unless the server holds more names than the order has files.
+    // Leaves the missing files in List3, unless the count or a folder that was not read says nothing of them.
     void compare(int attempt) {
         m_sender.check.check(attempt);
-        if (m_sender.check.NumOnServer >= m_sender.NumToSend || m_stop.left)
+        if (!m_sender.lacksFiles() || m_stop.left)
             return;
         // The check may have failed and counted an older listing.
         m_sender.check.ListServerFiles();
-        if (m_sender.check.NumOnServer < m_sender.NumToSend)
+        if (m_sender.lacksFiles())
             m_sender.check.RebuildMissing();
     }
 
     SendingPhase afterTheLast() override {
-        return m_sender.check.NumOnServer > m_sender.NumToSend ? m_sender.silentEnd() : SendingPhase::NotAll;
+        return m_sender.verdict() == Verdict::NotKnown ? m_sender.silentEnd() : SendingPhase::NotAll;
     }
 
     FtpSender& m_sender;
@@ -89,11 +91,14 @@ private:
 
     std::optional<SendingPhase> checkArrival(int round) override {
         m_sender.check.ListServerFiles();
-        if (m_sender.allCounted() && (m_sender.check.freshCount || !m_stop.StopFlag))
-            return SendingPhase::Success;
+        const Verdict verdict = m_sender.verdict();
+        if (verdict == Verdict::All && (m_sender.check.freshCount || !m_stop.StopFlag))
+            return m_sender.arrivedEnd();
         if (stopped())
             return SendingPhase::Stopped;
-        if (m_sender.check.NumOnServer < m_sender.NumToSend) {
+        if (verdict == Verdict::ServerChanges)
+            return m_sender.changedEnd();
+        if (m_sender.lacksFiles()) {
             m_sender.session.RoundNo = HoldIn16Bits(round);
             m_events.reached(SendingMoment::RoundFailed, round);
             m_anyFailed = true;
@@ -116,7 +121,7 @@ private:
 FtpSender::FtpSender(SessionState& state, const Platform& platform, SendingEvents& events)
     : session(state, platform, events, stop, lists)
     , pass(state, platform, events, stop, lists, session)
-    , check(state.transfer, platform.pump, events, stop, lists, session)
+    , check(state.transfer, platform, events, stop, lists, session)
     , m_platform(platform)
     , m_events(events) {}
 
@@ -147,10 +152,14 @@ void FtpSender::beginOrder() {
 
 void FtpSender::takeBroken() {
     const OrderJournal& journal = *session.journal();
-    for (const QString& path : ReadBrokenFiles(m_platform.files, journal.folder()) + journal.state().filesInHand) {
+    const QStringList reported = ReadBrokenFiles(m_platform.files, journal.folder());
+    QStringList inHand = journal.state().filesInHand;
+    for (const QString& path : reported + inHand) {
         if (lists.List3.contains(path) && !lists.List4Broken.contains(path))
             lists.List4Broken.append(path);
     }
+    inHand.removeIf([&](const QString& path) { return reported.contains(path); });
+    pass.beginOrder(inHand);
 }
 
 std::int16_t FtpSender::countList3() const {
@@ -175,8 +184,45 @@ std::optional<SendingPhase> FtpSender::runOlderRounds() {
     return OlderRounds(*this, m_events).run(olderRounds, SendingMoment::RoundBegins);
 }
 
+FtpSender::Verdict FtpSender::verdict() const {
+    if (!session.provesArrival()) {
+        if (check.NumOnServer > NumToSend)
+            return Verdict::NotKnown;
+        return check.NumOnServer == NumToSend && !check.unreadable ? Verdict::All : Verdict::Missing;
+    }
+    if (!check.proof)
+        return Verdict::NotKnown;
+    if (check.missing().isEmpty())
+        return Verdict::All;
+    return session.lineEndsExplain(*check.proof, lists.List4Makor.items()) ? Verdict::ServerChanges : Verdict::Missing;
+}
+
+bool FtpSender::lacksFiles() const {
+    return session.provesArrival() ? verdict() == Verdict::Missing || verdict() == Verdict::NotKnown
+                                   : check.NumOnServer < NumToSend;
+}
+
+bool FtpSender::orderArrived(SendingPhase end) const {
+    return end == SendingPhase::Success || (end == SendingPhase::AllThere && !session.provesArrival());
+}
+
+SendingPhase FtpSender::arrivedEnd() const {
+    return check.orderProven || !session.provesArrival() ? SendingPhase::Success : SendingPhase::AllThere;
+}
+
+SendingPhase FtpSender::changedEnd() {
+    pass.tellChanged();
+    return SendingPhase::CallLab;
+}
+
 SendingPhase FtpSender::silentEnd() const {
-    return check.missing().isEmpty() && check.NumOnServer >= NumToSend ? SendingPhase::AllThere : SendingPhase::Unclear;
+    if (!session.provesArrival())
+        return check.missing().isEmpty() && check.NumOnServer >= NumToSend ? SendingPhase::AllThere
+                                                                           : SendingPhase::Unclear;
+    if (verdict() == Verdict::All)
+        return arrivedEnd();
+    // All was sent, and the folder can't be read: nobody knows.
+    return pass.triedAll() ? SendingPhase::Unclear : SendingPhase::NotAll;
 }
 
 } // namespace lumora

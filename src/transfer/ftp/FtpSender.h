@@ -32,10 +32,21 @@ public:
     // The older bulk path: up to three rounds over List3, each followed by a check.
     std::optional<SendingPhase> runOlderRounds();
 
-    // True when the last check counted as many files as the order has.
-    bool allCounted() const { return check.NumOnServer == NumToSend && !check.unreadable; }
+    // What the last check says of the order. As built in by the count of names, else by the proof of names and lengths.
+    enum class Verdict {
+        All,
+        Missing,
+        NotKnown,      // as built in: the server has more names than the order; else: the folder could not be read
+        ServerChanges, // what is there has other line ends
+    };
+    Verdict verdict() const;
+    // True when this end means that the whole order has arrived.
+    bool orderArrived(SendingPhase end) const;
+    bool provenByNameOnly() const { return !check.proof || check.proof->provenByNameOnly(); }
     // The end when nothing is left to send but the counts differ.
     SendingPhase silentEnd() const;
+    // The end when all of the sending has arrived: of a chosen part, the order may not be whole.
+    SendingPhase arrivedEnd() const;
 
     FtpLists lists;
     SendingStop stop;
@@ -46,6 +57,9 @@ public:
 
 private:
     void takeBroken();
+    // True when the count of the last check allows a verdict of missing files.
+    bool lacksFiles() const;
+    SendingPhase changedEnd();
 
     class FourAttempts;
     class OlderRounds;

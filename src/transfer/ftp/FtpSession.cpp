@@ -44,11 +44,14 @@ FtpSession::FtpSession(SessionState& state, const Platform& platform, SendingEve
     , m_events(events)
     , m_stop(stop)
     , m_lists(lists)
-    , m_folderOwner(state, platform.files) {}
+    , m_folderOwner(state, platform.files)
+    , m_arrival(state, platform.files) {}
 
 void FtpSession::beginOrder() {
     m_putBegun = false;
     m_owner = FtpFolderOwner::Owner::NotKnown;
+    m_arrival.beginOrder();
+    m_inFolder.clear();
     m_journal.emplace(m_platform.files, OrderFolder(m_transfer.OrderFolder));
 }
 
@@ -218,8 +221,33 @@ bool FtpSession::enterListedFolder(const QString& name) {
     if (!bActiveSession || !mayJoin(name))
         return false;
     FillListFromNames(Target::List6, name);
+    m_inFolder.clear();
+    for (const FtpEntry& entry : m_listing.entries) {
+        if (!entry.folder)
+            m_inFolder += {entry.name, entry.length};
+    }
     m_inOrderFolder = true;
     return true;
+}
+
+bool FtpSession::isOther(const QString& path) {
+    return hConnection && m_arrival.isOther(*hConnection, path, m_inFolder);
+}
+
+bool FtpSession::isWhole(const QString& path) {
+    return hConnection && m_arrival.isWhole(*hConnection, path, m_inFolder);
+}
+
+std::optional<ArrivalProof> FtpSession::prove(const QStringList& paths) {
+    return hConnection ? m_arrival.proofOf(*hConnection, paths, m_inFolder) : std::nullopt;
+}
+
+bool FtpSession::lineEndsChanged(const QString& path) {
+    return hConnection && m_arrival.lineEndsChanged(*hConnection, path);
+}
+
+bool FtpSession::lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const {
+    return m_arrival.lineEndsExplain(proof, paths);
 }
 
 // Asked once an order; a folder of another order of a chain is only looked at.
@@ -255,6 +283,7 @@ bool FtpSession::EnterOrderFolder() {
         return joinOrderFolder(name);
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
+    m_inFolder.clear();
     const bool made = FtpMakeOrderDir(name);
     if (made) {
         m_owner = FtpFolderOwner::Owner::Ours;

@@ -5,6 +5,7 @@
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/Attempts.h"
+#include "transfer/ftp/FtpArrival.h"
 #include "transfer/ftp/FtpFolderOwner.h"
 #include "transfer/ftp/FtpLists.h"
 
@@ -54,6 +55,13 @@ public:
     // folder is another order's, with List6 unchanged.
     bool enterListedFolder(const QString& name);
     bool inOrderFolder() const { return m_inOrderFolder; }
+    // What the listing at entering the folder proves of files of the order, by FtpArrival.
+    bool provesArrival() const { return m_arrival.decides(); }
+    bool isOther(const QString& path);
+    bool isWhole(const QString& path);
+    std::optional<ArrivalProof> prove(const QStringList& paths);
+    bool lineEndsChanged(const QString& path);
+    bool lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const;
     // The folder under this order's name belongs to another order: nothing may be put.
     bool folderIsForeign() const { return m_owner == FtpFolderOwner::Owner::Foreign; }
     bool FtpMakeOrderDir(const QString& name);
@@ -134,7 +142,9 @@ private:
     std::optional<OrderJournal> m_journal;
     FtpFolderOwner m_folderOwner;
     FtpFolderOwner::Owner m_owner = FtpFolderOwner::Owner::NotKnown; // of the order's folder, until it is known
-    FtpListing m_listing;                                            // that was read last
+    FtpArrival m_arrival;
+    QList<RemoteFile> m_inFolder; // the files that List6 names
+    FtpListing m_listing;         // that was read last
     bool m_inOrderFolder = false;
     bool m_putBegun = false; // a put of this order has been tried, so its folder may hold something
     // Each file of a pass opens a session; these failures are told once a pass.

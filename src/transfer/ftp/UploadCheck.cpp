@@ -3,7 +3,12 @@
 #include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "order/BrokenFiles.h"
+#include "order/OrderCompleteness.h"
+#include "order/OrderFolder.h"
+#include "order/OrderLog.h"
 #include "platform/Machine.h"
+#include "platform/files/Files.h"
+#include "transfer/delivery/OrderFiles.h"
 
 #include <array>
 #include <vector>
@@ -107,6 +112,8 @@ void UploadCheck::count() {
 void UploadCheck::ListServerFiles() {
     freshCount = false;
     unreadable = false;
+    proof.reset();
+    orderProven = false;
     freshConnection();
     if (m_stop.left)
         return;
@@ -118,6 +125,7 @@ void UploadCheck::ListServerFiles() {
     if (freshCount) {
         count();
         m_events.reached(SendingMoment::Listed, NumOnServer);
+        prove();
     }
     filterDots();
     count();
@@ -125,13 +133,39 @@ void UploadCheck::ListServerFiles() {
     m_session.FtpCloseConnection();
 }
 
+// Before the connection leaves the folder.
+void UploadCheck::prove() {
+    proof = m_session.prove(m_lists.List4Makor.items());
+    orderProven = proof && missing().isEmpty() && wholeOrderThere();
+}
+
+bool UploadCheck::wholeOrderThere() {
+    const OrderFolder order(m_transfer.OrderFolder);
+    const QStringList entries = m_files.names(order.path(), u"*.gbr;*.jpp;*.prk"_s);
+    QStringList rest = FtpOrderFiles(m_files, order, entries, m_transfer.Mefurak == Travel::Pieces);
+    rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
+    const std::optional<ArrivalProof> ofRest = m_session.prove(rest);
+    if (!ofRest || !ofRest->proven())
+        return false;
+    OrderLog log;
+    if (const Result<QByteArray> bytes = m_files.read(order.logPath()))
+        log.read(*bytes);
+    const QStringList there = m_lists.List6.items();
+    const auto verdict = OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict();
+    return verdict == OrderCompleteness::Verdict::Whole || verdict == OrderCompleteness::Verdict::Unknown;
+}
+
 void UploadCheck::RecheckBroken() {
     m_freshListing = false;
     if (nothingBroken())
         return;
     freshConnection();
-    if (m_stop.left || !m_session.insideOrderBase())
+    if (m_stop.left)
         return;
+    if (!m_session.insideOrderBase()) {
+        m_events.reached(SendingMoment::OutsideFolder);
+        return;
+    }
     m_freshListing = lookUp();
     m_events.reached(SendingMoment::CheckingBroken);
     filterDots();
@@ -183,24 +217,39 @@ void UploadCheck::ConfirmBrokenGone() {
 QStringList UploadCheck::missing() const {
     QStringList paths;
     for (const QString& path : m_lists.List4Makor.items()) {
-        const QString name = LeafName(path);
-        if (!m_lists.List6.contains(name) || IsBroken(m_lists.List4Broken, name))
+        if (!isThere(LeafName(path)))
             paths.append(path);
     }
     return paths;
 }
 
+bool UploadCheck::isThere(const QString& name) const {
+    const bool broken = IsBroken(m_lists.List4Broken, name);
+    if (!proof)
+        return m_lists.List6.contains(name) && !broken;
+    if (proof->byLength.contains(name))
+        return true;
+    return !broken && !proof->missing.contains(name) && !proof->broken.contains(name);
+}
+
 void UploadCheck::RebuildMissing() {
-    if (NumOnServer >= m_lists.List4Makor.count())
+    if (!proof && NumOnServer >= m_lists.List4Makor.count())
         return;
     const QStringList paths = missing();
     m_lists.List3.clear();
     m_lists.List3.append(paths);
+    if (!proof || proof->broken.isEmpty())
+        return;
+    for (const QString& path : paths) {
+        if (proof->broken.contains(LeafName(path)) && !m_lists.List4Broken.contains(path))
+            m_lists.List4Broken.append(path);
+    }
+    m_session.keepBrokenFiles();
 }
 
 void UploadCheck::DropAlreadySent() {
     for (int i = m_lists.List3.lastIndex(); i >= 0; --i) {
-        if (m_lists.List6.contains(LeafName(m_lists.List3.item(i))))
+        if (isThere(LeafName(m_lists.List3.item(i))) && (proof || !m_session.provesArrival()))
             m_lists.List3.removeAt(i);
     }
 }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Platform.h"
 #include "transfer/ftp/FtpSession.h"
 
 namespace lumora {
@@ -9,10 +10,11 @@ namespace lumora {
 // dates are not compared.
 class UploadCheck {
 public:
-    UploadCheck(const TransferState& transfer, EventPump& pump, SendingEvents& events, SendingStop& stop,
+    UploadCheck(const TransferState& transfer, const Platform& platform, SendingEvents& events, SendingStop& stop,
                 FtpLists& lists, FtpSession& session)
         : m_transfer(transfer)
-        , m_pump(pump)
+        , m_files(platform.files)
+        , m_pump(platform.pump)
         , m_events(events)
         , m_stop(stop)
         , m_lists(lists)
@@ -30,7 +32,14 @@ public:
     // Removes from List3 what List6 names.
     void DropAlreadySent();
 
-    // Files of the order that are not on the server, or there only as the remains of a failed put.
+    // What the last ListServerFiles proves of the files of the sending; none as built in, and where it has not read the
+    // order's folder whole.
+    std::optional<ArrivalProof> proof;
+    // With the proof: the whole order lies there, also where the sending is only a part of it.
+    bool orderProven = false;
+
+    // Files of the order that are not on the server, or there only as the remains of a failed put; by the proof, where
+    // there is one.
     QStringList missing() const;
 
     // Names in List6 without the remains of failed puts.
@@ -40,12 +49,16 @@ public:
 
 private:
     bool lookUp();
+    void prove();
+    bool wholeOrderThere();
+    bool isThere(const QString& name) const;
     void filterDots();
     void count();
     bool nothingBroken() const { return m_lists.List4Broken.isEmpty() || m_lists.List6.isEmpty(); }
     void freshConnection();
 
     const TransferState& m_transfer;
+    const Files& m_files;
     EventPump& m_pump;
     SendingEvents& m_events;
     SendingStop& m_stop;

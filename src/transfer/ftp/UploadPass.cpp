@@ -8,6 +8,8 @@
 #include "platform/line/Internet.h"
 #include "transfer/delivery/UploadProgress.h"
 
+#include <algorithm>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -135,38 +137,86 @@ void UploadPass::UploadOneFile(int index) {
     closeWithPauses();
 }
 
+void UploadPass::beginOrder(const QStringList& inHand) {
+    m_inHand = inHand;
+    m_done.clear();
+}
+
+bool UploadPass::triedAll() const {
+    const QStringList& order = m_lists.List4Makor.items();
+    return std::all_of(order.begin(), order.end(), [&](const QString& path) { return m_done.contains(path); });
+}
+
+// As built in the name tells it alone. Remains are what a put has left that was not confirmed.
+bool UploadPass::liesThere(const QString& path, const QString& name) {
+    if (!m_lists.List6.contains(name))
+        return false;
+    if (!IsBroken(m_lists.List4Broken, name)) {
+        if (!m_session.isOther(path))
+            return true;
+    } else if (m_inHand.contains(path) && m_session.isWhole(path)) {
+        confirm(path);
+        return true;
+    }
+    // The server may still hold open the file of a broken connection; it accepts the name again after the remains are
+    // deleted.
+    m_session.remove(name);
+    return false;
+}
+
 void UploadPass::send(const QString& path) {
     const QString name = LeafName(path);
     m_events.sending(CurrentIndex, m_lists.List3.count(), name);
-    const bool onServer = m_lists.List6.contains(name);
-    const bool remains = onServer && IsBroken(m_lists.List4Broken, name);
-    if (onServer && !remains) {
+    if (liesThere(path, name)) {
         if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
             m_skipped += *length;
+        m_done += path;
         m_events.reached(SendingMoment::Skipped);
     } else {
-        // The server may still hold open the file of a broken connection; it accepts the name again after the remains
-        // are deleted.
-        if (remains)
-            m_session.remove(name);
         put(path, name);
     }
     m_events.reached(SendingMoment::FileDone, CurrentIndex + 1);
 }
 
+// The path leaves List4Broken.
+void UploadPass::confirm(const QString& path) {
+    TextList& broken = m_lists.List4Broken;
+    for (int i = broken.lastIndex(); i >= 0; --i) {
+        if (broken.item(i) == path)
+            broken.removeAt(i);
+    }
+    m_inHand.removeAll(path);
+    m_session.keepBrokenFiles();
+    m_session.keep(m_session.journal()->release(path));
+}
+
 void UploadPass::put(const QString& path, const QString& name) {
     TextList& broken = m_lists.List4Broken;
     BrokenBefore = broken.count();
-    const bool sent = m_session.FtpSendFile(path);
-    if (sent && IsBroken(broken, name)) {
-        for (int i = broken.lastIndex(); i >= 0; --i) {
-            if (broken.item(i) == path)
-                broken.removeAt(i);
-        }
-        m_session.keepBrokenFiles();
-    } else if (!sent && broken.count() > BrokenBefore) {
-        m_session.keepBrokenFiles();
+    if (!m_session.FtpSendFile(path)) {
+        m_inHand.removeAll(path);
+        if (broken.count() > BrokenBefore)
+            m_session.keepBrokenFiles();
+        return;
     }
+    if (IsBroken(broken, name))
+        confirm(path);
+    m_done += path;
+    if (!m_session.lineEndsChanged(path))
+        return;
+    broken.append(path);
+    m_session.keepBrokenFiles();
+    endBy(SendingPhase::CallLab, LineStep::ServerChanges, changed());
+}
+
+Failure UploadPass::changed() {
+    const Failure why{Failure::Kind::Damaged, u"this server changes files on the way: set Type = I"_s};
+    m_session.log(u' ' + why.message);
+    return why;
+}
+
+void UploadPass::tellChanged() {
+    m_events.failed(LineStep::ServerChanges, changed());
 }
 
 } // namespace lumora

@@ -4,6 +4,7 @@
 #include "transfer/ftp/FtpSession.h"
 
 #include <QDateTime>
+#include <QSet>
 
 namespace lumora {
 
@@ -19,9 +20,15 @@ public:
         , m_session(session)
         , m_silence(state) {}
 
+    // inHand: files whose put an earlier run has begun and neither confirmed nor reported as failed.
+    void beginOrder(const QStringList& inHand);
     void run();
     // An end of the sending that the last pass has reached by itself, and that another attempt would not mend.
     std::optional<SendingPhase> end() const { return m_end; }
+    // True when each file of the order has been put well or skipped.
+    bool triedAll() const;
+    // Tells customer and lab that the server stores other line ends.
+    void tellChanged();
     // Each second: ends a pass whose line is silent.
     void watch();
 
@@ -42,8 +49,11 @@ public:
 private:
     void endBy(SendingPhase end, LineStep step, const Failure& why);
     void endSilent();
+    Failure changed();
     void tellPiece(int index);
     void send(const QString& path);
+    bool liesThere(const QString& path, const QString& name);
+    void confirm(const QString& path);
     void put(const QString& path, const QString& name);
     void closeWithPauses();
 
@@ -53,6 +63,8 @@ private:
     FtpLists& m_lists;
     FtpSession& m_session;
     SilenceLimit m_silence;
+    QStringList m_inHand;
+    QSet<QString> m_done; // files of the order that were put well or skipped
     std::optional<SendingPhase> m_end;
     LineStep m_endStep = LineStep::Silence; // and why; not told where the page leads on by itself
     Failure m_endFailure;
