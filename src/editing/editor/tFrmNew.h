@@ -141,7 +141,7 @@ public:
     void Command15_Click() { widenMarkers(-CropFrame::step); }
     void CropHandle_MouseDown(CropFrame::Corner corner, QPointF at) { takeCorner(corner, at); }
     void CropHandle_MouseMove(QPointF at) { dragCorner(at); }
-    void CropHandle_MouseUp() { m_cropHandle.release(); }
+    void CropHandle_MouseUp() { releaseCorner(); }
 
     // The small view that the page of pictures stores, in logical pixels. Null if nothing was drawn since it was taken.
     Bitmap takeSmallView();
@@ -184,6 +184,7 @@ private:
     void widenMarkers(int pixels);
     void takeCorner(CropFrame::Corner corner, QPointF at);
     void dragCorner(QPointF at);
+    void releaseCorner() { m_cropHandle.release(); }
 
     // Held buttons, turning, dragging.
     void holdTool(int index);
