@@ -124,6 +124,11 @@ def foreign_order(session, line):
     session.relay.lab.put_foreign_order()
 
 
+def foreign_order_meanwhile(session, line):
+    session.relay.lab.put_foreign_order()
+    return session.forward(line)
+
+
 def put_stray(session, line):
     session.relay.lab.put_stray()
 
@@ -163,6 +168,7 @@ FTP = [
     Fault('IPv6 only', host='ipv6'),
     Fault('connects and stays silent', {'CONNECT': hang}, clock=120, limit=150, only=('scripted',)),
     Fault('connects and stays silent, twice', {'CONNECT': (hang, 2, 3)}, clock=20),
+    Fault('two files wait in vain, then not', {'CONNECT': (hang, 10)}, clock=60),
     Fault('too many clients, twice', {'CONNECT': (bye('421 Too many connections'), 2, 2)}),
     Fault('too many clients, always', {'CONNECT': bye('421 Too many connections')}),
     Fault('one connection for each address', {'CONNECT': refuse_second}),
@@ -181,6 +187,7 @@ FTP = [
     Fault('a folder is made at the second time', {'MKD': (reply('550 Create directory operation failed'), 1)}),
     Fault('the folder cannot be entered, once', {'CWD': (reply('550 Failed to change directory'), 1, 4)}),
     Fault('another order in the folder', {'CONNECT': (foreign_order, 1)}, only=('scripted',)),
+    Fault('another order comes behind the listing', {'MKD': (foreign_order_meanwhile, 1)}, only=('scripted',)),
     Fault('a stray file in the folder', {'STOR': (put_stray, 1, 2)}, quick=True),
     # the data line
     Fault('no EPSV', no_epsv()),
@@ -189,6 +196,7 @@ FTP = [
     Fault('no EPSV, PASV without parentheses', no_epsv(passed(answer=without_parentheses))),
     Fault('no passive', no_epsv(reply('550 Permission denied'))),
     Fault('30 kB/s', {'STOR': passed(rate=300_000)}, limit=120),
+    Fault('0.3 kB/s for ever', {'STOR': passed(rate=20_000)}, clock=60, only=('scripted',)),
     # a put that is refused
     Fault('STOR refused, once', {'STOR': (reply('550 Permission denied'), 1, PRINT)}),
     Fault('STOR refused, always', {'STOR': (reply('553 Could not create file'), ALWAYS, PRINT)}),
@@ -222,6 +230,7 @@ FTP = [
     Fault('226, the file is half, SIZE refused, bare names',
           {'STOR': (passed(change=half), 1, PRINT), 'SIZE': reply('500 unknown'), 'LIST': lines_as(LISTINGS['bare names'])},
           literal='no length is to be had'),
+    Fault('SIZE tells other than the listing', {'SIZE': reply('213 5')}),
     Fault('226, the file is gone', {'STOR': (then_gone(), 1, PRINT)}),
     Fault('226, the file is gone, and a stray one there',
           {'STOR': (then_gone(), 1, PRINT), 'EPSV': (put_stray, 1, 10)}),
