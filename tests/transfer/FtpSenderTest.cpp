@@ -297,6 +297,20 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
     }
 }
 
+TEST_F(FtpSenderTest, AConnectionOpenedByHandIsClosedBeforeTheSending) {
+    walk();
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
+    EXPECT_EQ(told.number(AttemptBegins), 1);
+}
+
+TEST_F(FtpSenderTest, ARecheckThatDoesNotReachTheFolderSaysSo) {
+    lists.List4Broken.append(path(u"01a.jpp"_s).text());
+    lists.List6.append(u"01a.jpp"_s);
+    lab.folders.erase(base);
+    sender.check.RecheckBroken();
+    EXPECT_EQ(told.count(OutsideFolder), 1);
+}
+
 TEST_F(FtpSenderTest, TheOlderBulkPathSendsInRounds) {
     lab.putFaults = {{u"01a.jpp"_s, 1, -1}};
     EXPECT_EQ(sender.runOlderRounds(), SendingPhase::Success);

@@ -113,8 +113,9 @@ private:
     void FtpEnableControls(bool enable);
 
     // FtpFrmGuards.cpp
-    bool mayBeSent();                   // what List3 names makes an order
-    void prepareAgain();                // the order's number is another order's on the server
+    bool mayBeSent();    // what List3 names makes an order
+    void prepareAgain(); // the order's number is another order's on the server
+    void tellForeign();
     void keepArrival(SendingPhase end); // in the order's state
     void tellLab();                     // report and done call
     void watchLine();                   // each second of a sending

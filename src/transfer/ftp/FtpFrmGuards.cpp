@@ -28,7 +28,7 @@ void FtpFrm::prepareAgain() {
     const bool plain = printsAsTheyAre(kept.kind);
     const Outcome next = plain ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;
     if (!m_chain.canFollow(id(), next)) {
-        failed(LineStep::ForeignFolder, {Failure::Kind::InUse, before.name()}, {});
+        tellForeign();
         finish(SendingPhase::CallLab);
         return;
     }
@@ -45,6 +45,10 @@ void FtpFrm::prepareAgain() {
     showNumberTaken(kept.number);
     if (!m_sender.stop.left)
         m_chain.follow(id(), next);
+}
+
+void FtpFrm::tellForeign() {
+    failed(LineStep::ForeignFolder, {Failure::Kind::InUse, m_state.transfer.ShemTikiya}, {});
 }
 
 void FtpFrm::watchLine() {

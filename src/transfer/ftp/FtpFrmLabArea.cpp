@@ -84,6 +84,10 @@ void FtpFrm::SendChainOrder(const QString& name) {
             m_sender.check.DropAlreadySent();
             end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
         }
+        if (end == SendingPhase::NumberTaken) { // no page is left in the middle of a chain
+            tellForeign();
+            end = SendingPhase::CallLab;
+        }
         if (end == SendingPhase::NotAll)
             showFailure();
     }

@@ -173,6 +173,7 @@ void FtpSender::refill() {
 
 std::optional<SendingPhase> FtpSender::RunAttempts() {
     pass.UserStopped = 0;
+    closeOpened();
     const StoppableLine line(m_platform);
     return FourAttempts(*this, m_events).run(attempts);
 }
@@ -180,6 +181,7 @@ std::optional<SendingPhase> FtpSender::RunAttempts() {
 std::optional<SendingPhase> FtpSender::runOlderRounds() {
     session.beginPass();
     pass.UserStopped = 0;
+    closeOpened();
     const StoppableLine line(m_platform);
     return OlderRounds(*this, m_events).run(olderRounds, SendingMoment::RoundBegins);
 }
@@ -213,6 +215,12 @@ SendingPhase FtpSender::arrivedEnd() const {
 SendingPhase FtpSender::changedEnd() {
     pass.tellChanged();
     return SendingPhase::CallLab;
+}
+
+// A connection that was opened by hand stands in another folder than the one where the walk begins.
+void FtpSender::closeOpened() {
+    if (session.hConnection)
+        session.closeSession();
 }
 
 SendingPhase FtpSender::silentEnd() const {

@@ -57,6 +57,7 @@ public:
 
 private:
     void takeBroken();
+    void closeOpened();
     // True when the count of the last check allows a verdict of missing files.
     bool lacksFiles() const;
     SendingPhase changedEnd();
