@@ -1,7 +1,8 @@
 #include "support/FakeLab.h"
 
+#include "common/HostFile.h"
+
 #include <fstream>
-#include <iterator>
 
 namespace lumora {
 
@@ -51,18 +52,16 @@ public:
     Result<void> put(const HostPath& local, const QString& remoteName) override {
         if (isCut())
             return cut();
-        std::ifstream in(local, std::ios::binary);
-        if (!in)
+        const Result<QByteArray> content = readWholeFile(local, remoteName, 1 << 30);
+        if (!content)
             return Failure{Failure::Kind::NotFound, remoteName};
         if (isBroken(remoteName))
             return no(u"553 Could not create file."_s);
         m_lab.puts += remoteName;
         if (m_lab.onPut)
             m_lab.onPut(remoteName);
-        const std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
-        QByteArray content = QByteArray::fromStdString(bytes);
         if (isCut()) { // meanwhile
-            m_lab.folders[m_here][remoteName] = content.left(content.size() / 2);
+            m_lab.folders[m_here][remoteName] = content->left(content->size() / 2);
             return cut();
         }
         for (FakeLab::PutFault& fault : m_lab.putFaults) {
@@ -70,11 +69,11 @@ public:
                 continue;
             if (fault.cutAfter < 0)
                 return no(u"553 Could not create file."_s);
-            m_lab.folders[m_here][remoteName] = content.left(fault.cutAfter);
+            m_lab.folders[m_here][remoteName] = content->left(fault.cutAfter);
             m_cut = true;
             return cut();
         }
-        const std::optional<QByteArray> stored = m_lab.stores ? m_lab.stores(remoteName, content) : content;
+        const std::optional<QByteArray> stored = m_lab.stores ? m_lab.stores(remoteName, *content) : *content;
         if (stored)
             m_lab.folders[m_here][remoteName] = *stored;
         return {};
@@ -182,22 +181,6 @@ Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const
 Result<QByteArray> FakeLab::fetch(const QString& url) {
     urls += url;
     return QByteArray("ok");
-}
-
-Result<QByteArray> FakeLab::post(const QString& url, const PostRequest&) {
-    urls += url;
-    return QByteArray("ok");
-}
-
-Result<std::optional<qint64>> FakeLab::contentLength(const QString& url) {
-    urls += url;
-    return std::optional<qint64>();
-}
-
-Result<void> FakeLab::download(const QString& url, const HostPath& target) {
-    urls += url;
-    std::ofstream(target, std::ios::binary) << "ok";
-    return {};
 }
 
 } // namespace lumora

@@ -1,9 +1,8 @@
 #pragma once
 
-#include "platform/line/Internet.h"
+#include "support/TestPlatform.h"
 
 #include <QByteArray>
-#include <QStringList>
 
 #include <functional>
 #include <map>
@@ -13,7 +12,7 @@ namespace lumora {
 
 // A lab in memory: an FTP server with folders and files, a web site that notes what it is asked, and faults by script.
 // The line in between may be down, the login refused, a put refused or cut in its middle, a delete refused.
-class FakeLab : public Internet {
+class FakeLab : public NoInternet {
 public:
     // Folders by their path below the root, without a leading slash; the root itself is "".
     using Folder = std::map<QString, QByteArray>;
@@ -67,10 +66,10 @@ public:
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
     Result<QByteArray> fetch(const QString& url) override;
-    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
-    Result<std::optional<qint64>> contentLength(const QString& url) override;
     void abort() override { ++aborts; }
-    Result<void> download(const QString& url, const HostPath& target) override;
+
+    // True as often as the counter says.
+    static bool strikes(int& counter);
 
     DataChannel lastChannel = DataChannel::Passive;
 };

@@ -7,6 +7,8 @@
 #include <QString>
 #include <QTemporaryDir>
 
+#include <functional>
+#include <initializer_list>
 #include <map>
 
 namespace lumora {
@@ -58,34 +60,59 @@ private:
     quint16 m_httpPort = 0;
 };
 
-// A second kind of web server over the same scripts: lighttpd, which runs php-cgi anew for each request.
-class SecondWebServer {
-public:
-    SecondWebServer();
-    ~SecondWebServer();
-    SecondWebServer(const SecondWebServer&) = delete;
-    SecondWebServer& operator=(const SecondWebServer&) = delete;
-
-    bool running() const { return m_failure.isEmpty(); }
-    QString failure() const { return m_failure; }
-    QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_port); }
-    HostPath uploads() const { return toHostPath(m_folder.path()) / "uploads"; }
-
-private:
-    QTemporaryDir m_folder;
-    QProcess m_server;
-    QString m_failure;
-    quint16 m_port = 0;
-};
-
-// Waits until the server answers on its port; false when it ended, as on a port that another took meanwhile, or never
-// answered.
-bool ComesUp(QProcess& server, quint16 port);
-
 // The plain files of a folder by name; none if the folder isn't there.
 std::map<QString, QByteArray> FilesIn(const HostPath& folder);
 
 // A port of 127.0.0.1 on which nothing listens at the moment.
 quint16 FreePort();
+
+// A server program on free ports of 127.0.0.1 over a temporary folder, ended with this object. A test asserts running()
+// and so fails, and never skips, where it could not start.
+class ServerProcess {
+public:
+    ServerProcess(const ServerProcess&) = delete;
+    ServerProcess& operator=(const ServerProcess&) = delete;
+
+    bool running() const { return m_failure.isEmpty(); }
+    QString failure() const { return m_failure; }
+
+protected:
+    ServerProcess() = default;
+    ~ServerProcess();
+    // Starts the program and its arguments, which are asked for once the ports are known; again on other ports when one
+    // was taken meanwhile.
+    void start(std::initializer_list<quint16*> ports, const std::function<QStringList()>& command);
+
+    QTemporaryDir m_folder;
+    QProcess m_server;
+    QString m_failure;
+};
+
+// A second kind of web server over the same scripts: lighttpd, which runs php-cgi anew for each request.
+class SecondWebServer : public ServerProcess {
+public:
+    SecondWebServer();
+
+    QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_port); }
+    HostPath uploads() const { return toHostPath(m_folder.path()) / "uploads"; }
+
+private:
+    quint16 m_port = 0;
+};
+
+// A second kind of FTP server: pyftpdlib.
+class SecondFtpServer : public ServerProcess {
+public:
+    SecondFtpServer();
+    ~SecondFtpServer();
+
+    QString ftpHost() const { return u"127.0.0.1:%1"_s.arg(m_port); }
+    static QString user() { return u"lumora"_s; }
+    static QString password() { return u"second-lab"_s; }
+    HostPath account() const { return toHostPath(m_folder.filePath(u"account"_s)); }
+
+private:
+    quint16 m_port = 0;
+};
 
 } // namespace lumora

@@ -1,7 +1,5 @@
 #include "support/MailServer.h"
 
-#include "support/LabServers.h"
-
 #include <QElapsedTimer>
 #include <QFile>
 #include <QThread>
@@ -93,29 +91,15 @@ MailServer::MailServer(Disk disk, Encryption encryption) {
         std::filesystem::create_directory(toHostPath(path));
         QFile::setPermissions(path, open);
     }
-    m_server.setProcessChannelMode(QProcess::MergedChannels);
-    if (!makeCertificate())
-        return;
-    for (int attempt = 0; attempt < 3; ++attempt) {
-        m_port = FreePort();
-        m_tlsPort = FreePort();
-        const QString file = configure(disk, encryption);
-        QStringList command = asRoot({u"/usr/sbin/exim4"_s, u"-C"_s, file, u"-bdf"_s});
-        const QString program = command.takeFirst();
-        m_server.start(program, command);
-        if (ComesUp(m_server, m_port) && ComesUp(m_server, m_tlsPort))
-            return;
-    }
-    m_failure = u"exim4 did not start: "_s + QString::fromUtf8(m_server.readAll());
+    if (makeCertificate())
+        start({&m_port, &m_tlsPort}, [&] {
+            return asRoot({u"/usr/sbin/exim4"_s, u"-C"_s, configure(disk, encryption), u"-bdf"_s});
+        });
 }
 
 MailServer::~MailServer() {
-    if (m_server.state() != QProcess::NotRunning) {
-        m_server.terminate();
-        if (!m_server.waitForFinished(5'000))
-            m_server.kill();
-        m_server.waitForFinished(5'000);
-    }
+    m_server.terminate();
+    m_server.waitForFinished(5'000);
     // QTemporaryDir does not remove the files of the server's user.
     outputOf(asRoot({u"rm"_s, u"-rf"_s, m_folder.path()}));
 }
@@ -124,15 +108,13 @@ QString MailServer::configure(Disk disk, Encryption encryption) const {
     const QString path = m_folder.filePath(u"exim.conf"_s);
     const MailAccount known = account();
     QString text = QLatin1String(configuration);
-    text.replace(u"%1"_s, m_folder.path());
-    text.replace(u"%2"_s, QString::number(m_port));
-    text.replace(u"%3"_s, QString::number(m_tlsPort));
-    text.replace(u"%4"_s, encryption == Encryption::Offered ? u"*"_s : QString());
-    text.replace(u"%5"_s, QString::number(largestMessage));
-    // The full server asks for more free space than any disk has.
-    text.replace(u"%6"_s, disk == Disk::Full ? u"1000000G"_s : u"0"_s);
-    text.replace(u"%7"_s, known.user);
-    text.replace(u"%8"_s, known.password);
+    const QString values[] = {m_folder.path(), QString::number(m_port), QString::number(m_tlsPort),
+                              encryption == Encryption::Offered ? u"*"_s : QString(), QString::number(largestMessage),
+                              // The full server asks for more free space than any disk has.
+                              disk == Disk::Full ? u"1000000G"_s : u"0"_s, known.user, known.password};
+    int number = 0;
+    for (const QString& value : values)
+        text.replace(u'%' + QString::number(++number), value);
     QFile file(path);
     if (file.open(QIODevice::WriteOnly | QIODevice::Truncate))
         file.write(text.toUtf8());

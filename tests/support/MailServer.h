@@ -1,29 +1,21 @@
 #pragma once
 
 #include "platform/line/Mail.h"
+#include "support/LabServers.h"
 
 #include <QByteArray>
-#include <QProcess>
-#include <QTemporaryDir>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-// A real mail server (exim) over a temporary folder, on free ports of 127.0.0.1, ended with this object. It serves the
-// lab's one mailbox to those who log in. A test asserts running() and so fails, and never skips, where it could not
-// start.
-class MailServer {
+// A real mail server (exim). It serves the lab's one mailbox to those who log in.
+class MailServer : public ServerProcess {
 public:
     enum class Disk { WithRoom, Full };
     enum class Encryption { Offered, None };
     explicit MailServer(Disk disk = Disk::WithRoom, Encryption encryption = Encryption::Offered);
     ~MailServer();
-    MailServer(const MailServer&) = delete;
-    MailServer& operator=(const MailServer&) = delete;
-
-    bool running() const { return m_failure.isEmpty(); }
-    QString failure() const { return m_failure; }
 
     // An account that the server takes, to the lab's mailbox.
     MailAccount account(MailEncryption encryption = MailEncryption::None) const;
@@ -42,9 +34,6 @@ private:
     QString configure(Disk disk, Encryption encryption) const;
     bool makeCertificate();
 
-    QTemporaryDir m_folder;
-    QProcess m_server;
-    QString m_failure;
     quint16 m_port = 0;
     quint16 m_tlsPort = 0;
 };

@@ -33,31 +33,26 @@ Taps tapsOf(int index, double step) {
     return taps;
 }
 
-} // namespace
-
-ReferencePlane referenceScaled(const ReferencePlane& source, int width, int height, double stepX, double stepY) {
-    ReferencePlane narrow{width, source.height, std::vector<double>(static_cast<std::size_t>(width) * source.height)};
+// One step of the two: scaled across, and turned over its diagonal.
+ReferencePlane scaledAndTurned(const ReferencePlane& source, int width, double step) {
+    ReferencePlane target{source.height, width, std::vector<double>(static_cast<std::size_t>(width) * source.height)};
     for (int x = 0; x < width; ++x) {
-        const Taps taps = tapsOf(x, stepX);
+        const Taps taps = tapsOf(x, step);
         for (int y = 0; y < source.height; ++y) {
-            double sum = 0;
+            double& sum = target.samples[static_cast<std::size_t>(x) * source.height + y];
             for (std::size_t k = 0; k < taps.weights.size(); ++k) {
                 const int at = std::clamp(taps.first + static_cast<int>(k), 0, source.width - 1);
                 sum += taps.weights[k] * source.samples[static_cast<std::size_t>(y) * source.width + at];
             }
-            narrow.samples[static_cast<std::size_t>(y) * width + x] = sum;
         }
     }
-    ReferencePlane target{width, height, std::vector<double>(static_cast<std::size_t>(width) * height)};
-    for (int y = 0; y < height; ++y) {
-        const Taps taps = tapsOf(y, stepY);
-        for (std::size_t k = 0; k < taps.weights.size(); ++k) {
-            const int at = std::clamp(taps.first + static_cast<int>(k), 0, source.height - 1);
-            for (int x = 0; x < width; ++x)
-                target.samples[static_cast<std::size_t>(y) * width + x] +=
-                    taps.weights[k] * narrow.samples[static_cast<std::size_t>(at) * width + x];
-        }
-    }
+    return target;
+}
+
+} // namespace
+
+ReferencePlane referenceScaled(const ReferencePlane& source, int width, int height, double stepX, double stepY) {
+    ReferencePlane target = scaledAndTurned(scaledAndTurned(source, width, stepX), height, stepY);
     for (double& sample : target.samples)
         sample = std::clamp(sample, 0.0, 255.0);
     return target;

@@ -23,10 +23,7 @@ using namespace Qt::StringLiterals; // tests write their texts in the short form
 
 class RecordedDialogs : public Dialogs {
 public:
-    void message(const QString& text, const QString& title = {}) override {
-        messages += text;
-        titles += title;
-    }
+    void message(const QString& text, const QString& = {}) override { messages += text; }
     bool ask(const QString& question, const QString& title = {}) override {
         questions += question;
         questionTitles += title;
@@ -38,7 +35,6 @@ public:
     }
 
     QStringList messages;
-    QStringList titles;
     QStringList questions;
     QStringList questionTitles;
     QStringList pickRequests;
@@ -76,11 +72,10 @@ class RecordedShell : public Shell {
 public:
     void openWebPage(const QString& url) override { webPages += url; }
     void openFolder(const DrivePath& folder) override { folders += folder.text(); }
-    void copyToClipboard(const QString& text) override { clipboard = text; }
+    void copyToClipboard(const QString&) override {}
 
     QStringList webPages;
     QStringList folders;
-    QString clipboard;
 };
 
 class FixedVolume : public Volume {
