@@ -36,6 +36,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
               "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = ask\n"
+              "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
               "[Shops]\nShop2Phone = 03-5\n"
@@ -54,7 +55,9 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(lab.profile.QuickSizes[2], u"20/30");
     EXPECT_EQ(lab.HaKoopon, 1);
     EXPECT_EQ(lab.MinuyPaar, 2);
-    EXPECT_TRUE(lab.SplitPage);
+    EXPECT_TRUE(lab.SplitPage && lab.FitMuzag && lab.DoarReshut && lab.TachanaMekomit);
+    EXPECT_EQ(lab.GvulMuzag, 0);
+    EXPECT_EQ(lab.TmunatPaar, 1);
     EXPECT_EQ(lab.profile.ReportOn, 0);
     EXPECT_EQ(lab.MediniyutDchisa, 1);
     const MailAccount& mail = lab.profile.mail;

@@ -49,6 +49,7 @@ TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     state.EnglishTips = 1;
     deployment.SugTzad = 60;
     deployment.profile.LabPhone = u"09-9"_s;
+    deployment.profile.LabMail = u"lab@example.com"_s;
     state.handOver.notice = u"order 104 stays here"_s;
     hatchala& page = start();
     EXPECT_EQ(state.EnglishTips, 0);
@@ -58,6 +59,7 @@ TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     EXPECT_EQ(state.profile.AdFile2, u"C:\\lumora\\zmany\\ad02.jpg"_path);
     EXPECT_EQ(page.controls().List1.items(), QStringList({"* Haifa", "* Yaffo"}));
     EXPECT_EQ(page.controls().Label4Tel.text, u"09-9");
+    EXPECT_EQ(page.controls().Label1.text + u' ' + page.controls().Image8.text, u"lab@example.com www.lumora.example");
     EXPECT_EQ(page.controls().Notice.text, u"order 104 stays here");
     EXPECT_TRUE(page.controls().Notice.visible);
     EXPECT_TRUE(state.handOver.notice.isEmpty()) << "the line is for one customer";

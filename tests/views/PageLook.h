@@ -2,14 +2,14 @@
 
 #include "Walk.h"
 
-#include "session/Page.h"
+#include "views/window/MainWindow.h"
 
-#include <QSize>
+#include <QTimer>
+#include <QWidget>
 
 #include <gtest/gtest.h>
 
 #include <ostream>
-#include <string>
 
 namespace lumora {
 
@@ -40,9 +40,19 @@ protected:
         for (const QString& fault : walk.faults())
             ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
     }
-    void changed(Page& page, Walk& walk) {
-        Q_EMIT page.changed();
-        walk.settle(40);
+    void pressAndLook(Walk& walk, const QString& page, const QString& control, const QString& name) {
+        walk.press(page, control);
+        look(walk, name);
+    }
+    // The picker waits in an event loop of its own below the press: it is looked at from within, and cancelled.
+    void lookAtPicker(Walk& walk, const QString& page, const QString& button, const QString& name) {
+        QTimer::singleShot(400, &walk.program().window(), [&] {
+            look(walk, name);
+            QWidget& cancel = walk.control(u"pickerCancel"_s);
+            EXPECT_EQ(ControlFinder::whyNotPressable(cancel), QString());
+            QMetaObject::invokeMethod(&cancel, "click");
+        });
+        walk.press(page, button);
     }
 };
 

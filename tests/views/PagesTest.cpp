@@ -5,15 +5,10 @@
 #include "order/EditRecord.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "views/kit/Overlay.h"
-#include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
-
-#include <gtest/gtest.h>
 
 #include <QTest>
 #include <QTimer>
-#include <QWidget>
 
 namespace lumora {
 
@@ -25,19 +20,14 @@ TEST_P(PageLook, FromTheStartToTheTerms) {
     walk.toMenu();
     look(walk, u"02-menu"_s);
     if (walk.pressable(u"nnn"_s, u"Command14"_s)) {
-        walk.press(u"nnn"_s, u"Command14"_s);
-        look(walk, u"03-clean"_s);
+        pressAndLook(walk, u"nnn"_s, u"Command14"_s, u"03-clean"_s);
         walk.press(u"nnn"_s, u"Command9"_s);
     }
-    walk.press(u"nnn"_s, u"Command15"_s);
-    walk.waitFor(u"Havharot"_s);
+    walk.press(u"nnn"_s, u"Command15"_s, u"Havharot"_s);
     look(walk, u"04-notice"_s);
-    walk.press(u"Havharot"_s, u"Command1"_s);
-    walk.waitFor(u"nnn"_s);
-    walk.press(u"nnn"_s, u"Image1(0)"_s);
-    look(walk, u"05-details"_s);
-    walk.press(u"nnn"_s, u"Command10"_s);
-    look(walk, u"06-message"_s);
+    walk.press(u"Havharot"_s, u"Command1"_s, u"nnn"_s);
+    pressAndLook(walk, u"nnn"_s, u"Image1(0)"_s, u"05-details"_s);
+    pressAndLook(walk, u"nnn"_s, u"Command10"_s, u"06-message"_s);
     walk.program().dialogs().closeMessages();
     walk.toOptions();
     look(walk, u"07-options"_s);
@@ -55,34 +45,20 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
     walk.toTerms();
     walk.toPictures();
     look(walk, u"10-no-pictures"_s);
-    // The picker waits in an event loop of its own: it is looked at from within.
-    QTimer::singleShot(400, &walk.program().window(), [&] {
-        look(walk, u"11-picker"_s);
-        QWidget* cancel = walk.program().window().findChild<QWidget*>(u"pickerCancel"_s);
-        ASSERT_TRUE(cancel);
-        EXPECT_EQ(ControlFinder::whyNotPressable(*cancel), QString());
-        QMetaObject::invokeMethod(cancel, "click");
-    });
-    walk.press(u"kyoskNew"_s, u"Image5"_s);
+    lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
     walk.choosePictures();
     look(walk, u"12-pictures"_s);
-    walk.press(u"kyoskNew"_s, u"Picture2"_s);
-    walk.waitFor(u"Form3"_s);
+    walk.press(u"kyoskNew"_s, u"Picture2"_s, u"Form3"_s);
     look(walk, u"12-upright"_s);
-    walk.press(u"Form3"_s, u"Command1"_s);
-    look(walk, u"12-turned"_s);
-    walk.press(u"Form3"_s, u"Command3"_s);
-    walk.waitFor(u"kyoskNew"_s);
-    walk.press(u"kyoskNew"_s, u"Image6"_s);
-    look(walk, u"13-help"_s);
+    pressAndLook(walk, u"Form3"_s, u"Command1"_s, u"12-turned"_s);
+    walk.press(u"Form3"_s, u"Command3"_s, u"kyoskNew"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Image6"_s, u"13-help"_s);
     walk.press(u"kyoskNew"_s, u"helpClose"_s);
-    walk.press(u"kyoskNew"_s, u"Image10"_s);
-    look(walk, u"14-leave"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Image10"_s, u"14-leave"_s);
     walk.press(u"kyoskNew"_s, u"Command4"_s);
     walk.toClosing();
     look(walk, u"15-closing"_s);
-    walk.press(u"kyoskNew"_s, u"Command7"_s);
-    walk.waitFor(u"FtpFrm"_s);
+    walk.press(u"kyoskNew"_s, u"Command7"_s, u"FtpFrm"_s);
     walk.settle(200);
     look(walk, u"17-countdown"_s);
 }
@@ -97,26 +73,20 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     walk.press(u"nnn"_s, u"Image1(2)"_s);
     walk.toOptions();
     const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;
-    ASSERT_TRUE(
-        ControlFinder(walk.program().window()).choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex())).ok());
+    walk.choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex()));
     walk.press(u"nnn"_s, u"Option3(0)"_s);
     walk.toTerms();
     look(walk, u"23-fit"_s);
     walk.press(u"nnn"_s, u"Option5"_s);
     walk.toPictures();
-    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() / u"IMG_0001.jpg"; };
-    walk.press(u"kyoskNew"_s, u"Image5"_s);
-    walk.settle(300);
+    walk.pick(u"kyoskNew"_s, u"Image5"_s);
     look(walk, u"23-whole-folder"_s);
     walk.press(u"kyoskNew"_s, u"Command24"_s);
     walk.program().state().coupon.MisparKoopon = 14;
     walk.program().state().coupon.HaKoopon = 1;
-    walk.press(u"kyoskNew"_s, u"Image7"_s);
-    look(walk, u"24-panel-in-front"_s);
-    walk.press(u"kyoskNew"_s, u"Command21"_s);
-    look(walk, u"24-branches"_s);
-    walk.press(u"kyoskNew"_s, u"Command4Snif(10)"_s);
-    look(walk, u"24-closing-coupon"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Image7"_s, u"24-panel-in-front"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Command21"_s, u"24-branches"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Command4Snif(10)"_s, u"24-closing-coupon"_s);
 }
 
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
@@ -125,6 +95,8 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     state.Optint = OrderKind::EditedPrint;
     state.shemot.ppr = u"10/15"_s;
     state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+    walk.program().chain().show(PageId::Form2);
+    look(walk, u"25-plain-to-prepare"_s);
     const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder().text();
     state.handOver.lines = {code + u"\\missing picture.jpg"_s};
     for (int i = 1; i <= 12; ++i)
@@ -153,51 +125,48 @@ TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     Walk walk(GetParam(), u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
     walk.toMenu();
     walk.press(u"nnn"_s, u"Image1(6)"_s);
-    const ControlFinder finder(walk.program().window());
     const auto lookAtRest = [&](const QString& name) {
         const AlbumControls& album = walk.page<nnn>(PageId::nnn).album().controls();
         EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }, 60000));
         look(walk, name);
     };
-    walk.type(u"nnn"_s, u"Text1(0)"_s, u"Studio Or"_s);
-    walk.type(u"nnn"_s, u"Text1(1)"_s, u"03-7654321"_s);
-    walk.type(u"nnn"_s, u"Text1(2)"_s, u"Wedding"_s);
-    walk.type(u"nnn"_s, u"Text1(3)"_s, u"studio"_s);
-    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Mail"_s, u"gmail.com"_s).ok());
+    int box = 0;
+    for (const QString& text : {u"Studio Or"_s, u"03-7654321"_s, u"Wedding"_s, u"studio"_s})
+        walk.type(u"nnn"_s, u"Text1(%1)"_s.arg(box++), text);
+    walk.choose(u"nnn"_s, u"Combo4Mail"_s, u"gmail.com"_s);
     lookAtRest(u"40-album-photographer"_s);
     walk.press(u"nnn"_s, u"Command17"_s);
     lookAtRest(u"41-album-kinds"_s);
     walk.press(u"nnn"_s, u"SoogAlb(4)"_s);
-    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check4"_s, true).ok());
+    walk.tick(u"nnn"_s, u"Check4"_s);
     walk.press(u"nnn"_s, u"Command27"_s);
-    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Horim"_s, u"30/60"_s).ok());
+    walk.choose(u"nnn"_s, u"Combo4Horim"_s, u"30/60"_s);
     lookAtRest(u"42-album-parents"_s);
     walk.press(u"nnn"_s, u"Command16"_s);
-    ASSERT_TRUE(finder.choose(u"nnn"_s, u"Combo4Godel"_s, u"30/60"_s).ok());
+    walk.choose(u"nnn"_s, u"Combo4Godel"_s, u"30/60"_s);
     lookAtRest(u"43-album-size"_s);
     walk.press(u"nnn"_s, u"Command18"_s);
     walk.press(u"nnn"_s, u"Combo4Cricha(1)"_s);
     lookAtRest(u"44-album-cover"_s);
+    walk.key(Qt::Key_Escape);
+    EXPECT_EQ(walk.page<nnn>(PageId::nnn).album().panel(), AlbumPanels::Panel::Size) << "Esc goes one panel back";
+    walk.press(u"nnn"_s, u"Command18"_s);
     walk.press(u"nnn"_s, u"Command19"_s);
     walk.press(u"nnn"_s, u"Combo4Niyar(2)"_s);
     lookAtRest(u"45-album-paper"_s);
     walk.press(u"nnn"_s, u"Command20"_s);
     walk.press(u"nnn"_s, u"Combo4Tosefet(1)"_s);
-    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check3(2)"_s, true).ok());
+    walk.tick(u"nnn"_s, u"Check3(2)"_s);
     lookAtRest(u"46-album-extras"_s);
     walk.press(u"nnn"_s, u"Command21"_s);
-    ASSERT_TRUE(finder.tick(u"nnn"_s, u"Check6"_s, true).ok());
+    walk.tick(u"nnn"_s, u"Check6"_s);
     lookAtRest(u"47-album-bill"_s);
-    walk.press(u"nnn"_s, u"Command22"_s);
-    walk.waitFor(u"kyoskNew"_s);
-    walk.program().dialogs().nextPick = [&] { return walk.pictureFolder() / u"IMG_0001.jpg"; };
-    walk.press(u"kyoskNew"_s, u"Image5"_s);
-    walk.settle(300);
+    walk.press(u"nnn"_s, u"Command22"_s, u"kyoskNew"_s);
+    walk.pick(u"kyoskNew"_s, u"Image5"_s);
     EXPECT_TRUE(walk.pressable(u"kyoskNew"_s, u"Image13"_s));
     look(walk, u"48-album-pictures"_s);
     walk.press(u"kyoskNew"_s, u"Command24"_s);
-    walk.press(u"kyoskNew"_s, u"Image7"_s);
-    look(walk, u"49-album-closing"_s);
+    pressAndLook(walk, u"kyoskNew"_s, u"Image7"_s, u"49-album-closing"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens(), PageLook::nameOf);

@@ -1,10 +1,7 @@
 #include "PageLook.h"
 
-#include "platform/Platform.h"
-#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "session/Workspace.h"
 #include "support/FakeWebLab.h"
 #include "transfer/ftp/FtpFrm.h"
 #include "transfer/http/UploadForm.h"
@@ -12,8 +9,6 @@
 #include "views/window/ScreenDialogs.h"
 
 #include <QTest>
-
-#include <gtest/gtest.h>
 
 namespace lumora {
 
@@ -36,18 +31,13 @@ protected:
         lab.folders[state.profile.FtpFolder2];
         state.MisparHazmana = u"105"_s;
         state.transfer.OrderFolder = u"C:\\2000lumora\\!!000"_path / orderName;
-        for (const DrivePath& folder :
-             {WorkspacePaths::root(state), WorkspacePaths::orders(state), state.transfer.OrderFolder})
-            EXPECT_TRUE(files().folderExists(folder) || files().makeFolder(folder).ok());
         for (const QString& name : {u"!105_1234.jpp"_s, first, u"111015GNB0001_03AACC.jpp"_s})
-            write(name);
-        EXPECT_TRUE(files().writeWhole(state.transfer.OrderFolder / (orderName + u".txt"_s),
-                                       "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n"));
+            write(name, "bytes");
+        write(orderName + u".txt"_s, "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n");
     }
 
-    const Files& files() { return walk.program().platform().files; }
-    void write(const QString& name) {
-        EXPECT_TRUE(files().writeWhole(walk.program().state().transfer.OrderFolder / name, "bytes"));
+    void write(const QString& name, const QByteArray& bytes) {
+        walk.write(walk.program().state().transfer.OrderFolder / name, bytes);
     }
     FakeLab::Folder& remote() { return lab.folders[walk.program().state().profile.FtpFolder2 + u'/' + orderName]; }
     template <class P>
@@ -58,6 +48,11 @@ protected:
         auto& page = walk.page<P>(P::pageId);
         QObject::connect(&page, &Page::changed, &page, [this] { lookIfDue(); });
         return page;
+    }
+    // The page counts down; its button starts at once.
+    void startNow(const SendingPage& page) {
+        until(page, SendingPhase::Countdown);
+        walk.press(u"FtpFrm"_s, u"Image5"_s);
     }
     void until(const SendingPage& page, SendingPhase phase) {
         ASSERT_TRUE(QTest::qWaitFor([&] { return page.phase() == phase; }, 30000))
@@ -81,13 +76,6 @@ protected:
     bool looking = false;
 };
 
-void countOut(UploadForm& page) {
-    while (page.controls().Picture1Width < UploadFormControls::Picture1FullWidth)
-        page.Timer1_Tick();
-    for (int tick = 0; tick < 7; ++tick)
-        page.Timer2_Tick();
-}
-
 } // namespace
 
 TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
@@ -97,8 +85,7 @@ TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
     walk.press(u"FtpFrm"_s, u"Command23"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Waiting);
     look(walk, u"17-waiting"_s);
-    walk.press(u"FtpFrm"_s, u"Image3"_s);
-    look(walk, u"20-leave-sending"_s);
+    pressAndLook(walk, u"FtpFrm"_s, u"Image3"_s, u"20-leave-sending"_s);
     walk.press(u"FtpFrm"_s, u"Command14"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Countdown);
 
@@ -113,8 +100,7 @@ TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
     EXPECT_EQ(page.phase(), SendingPhase::NotAll);
     EXPECT_TRUE(waits.empty());
     look(walk, u"19-failed"_s);
-    walk.press(u"FtpFrm"_s, u"Command24"_s);
-    look(walk, u"22-for-the-lab"_s);
+    pressAndLook(walk, u"FtpFrm"_s, u"Command24"_s, u"22-for-the-lab"_s);
     walk.press(u"FtpFrm"_s, u"Command9"_s);
 
     lab.putFaults.clear();
@@ -129,8 +115,7 @@ TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
 TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
     remote()[u"stranger.jpp"_s] = "x";
     auto& there = open<FtpFrm>();
-    until(there, SendingPhase::Countdown);
-    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    startNow(there);
     EXPECT_EQ(there.phase(), SendingPhase::AllThere);
     EXPECT_FALSE(walk.pressable(u"FtpFrm"_s, u"Command10"_s)) << "there is nothing to send again";
     look(walk, u"24-all-there"_s);
@@ -141,8 +126,7 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
     remote().clear();
     state.handOver.lines = {path, path};
     auto& twice = open<FtpFrm>();
-    until(twice, SendingPhase::Countdown);
-    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    startNow(twice);
     EXPECT_EQ(twice.phase(), SendingPhase::Unclear);
     EXPECT_TRUE(walk.pressable(u"FtpFrm"_s, u"Command10"_s));
     look(walk, u"24-unclear"_s);
@@ -150,9 +134,8 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
     state.handOver.lines = {path};
     remote().clear();
     auto& stopped = open<FtpFrm>();
-    until(stopped, SendingPhase::Countdown);
     lab.onPut = [&](const QString&) { stopped.Command15_Click(); };
-    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    startNow(stopped);
     EXPECT_EQ(stopped.phase(), SendingPhase::Stopped);
     walk.program().dialogs().closeMessages();
     look(walk, u"24-stopped"_s);
@@ -161,11 +144,10 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
 TEST_P(SendingLook, ByFtpInPieces) {
     walk.program().state().transfer.Mefurak = Travel::Pieces;
     for (const char* name : {"a_001_003.prk", "a_002_003.prk", "a_003_003.prk"})
-        write(QString::fromLatin1(name));
+        write(QString::fromLatin1(name), "piece");
     auto& page = open<FtpFrm>();
-    until(page, SendingPhase::Countdown);
     lookWhen(u"25-sending-pieces"_s, [&] { return page.controls().Label4Diff.visible; });
-    walk.press(u"FtpFrm"_s, u"Image5"_s);
+    startNow(page);
     EXPECT_TRUE(waits.empty());
 }
 
@@ -199,7 +181,10 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     lookWhen(u"63-http-sending"_s, [&] { return page.controls().percent >= 50; });
     lookWhen(u"64-http-sending-again"_s,
              [&] { return page.controls().percent == 25 && !page.controls().Label1.text.isEmpty(); });
-    countOut(page);
+    while (page.controls().Picture1Width < UploadFormControls::Picture1FullWidth)
+        page.Timer1_Tick();
+    for (int tick = 0; tick < 7; ++tick)
+        page.Timer2_Tick();
     EXPECT_EQ(page.phase(), SendingPhase::NotAll);
     look(walk, u"65-http-failed"_s);
 

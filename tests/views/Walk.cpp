@@ -15,6 +15,7 @@
 #include <QAbstractItemModel>
 #include <QAbstractScrollArea>
 #include <QAccessible>
+#include <QApplication>
 #include <QComboBox>
 #include <QCoreApplication>
 #include <QDir>
@@ -81,11 +82,6 @@ HostPath photographs() {
     static const bool made = writeSamplePhotographs(toHostPath(folder.path()), 14, 1.2).ok();
     EXPECT_TRUE(made);
     return toHostPath(folder.path());
-}
-
-// What a button says: in letters, or by its sign and a spoken name.
-bool hasText(const QAbstractButton& button) {
-    return !button.text().trimmed().isEmpty() || !button.accessibleName().trimmed().isEmpty();
 }
 
 QString rowsOf(const QAbstractItemModel& model) {
@@ -162,6 +158,10 @@ DrivePath Walk::pictureFolder() const {
     return m_program->platform().files.drives().toDrive(HostPath(m_folder.path().toStdString()) / "Pictures");
 }
 
+QString focusName() {
+    return QApplication::focusWidget() ? QApplication::focusWidget()->objectName() : QString();
+}
+
 Page* Walk::find(PageId id) {
     return m_program->chain().find(id);
 }
@@ -170,34 +170,69 @@ void Walk::settle(int milliseconds) {
     QTest::qWait(milliseconds);
 }
 
-void Walk::press(const QString& page, const QString& control) {
-    const Result<void> done = ControlFinder(m_program->window()).press(page, control);
-    EXPECT_TRUE(done.ok()) << (done ? "" : qPrintable(done.failure().message));
+void Walk::expectDone(const Result<void>& step) {
+    EXPECT_TRUE(step.ok()) << (step ? "" : qPrintable(step.failure().message));
     settle();
+}
+
+void Walk::press(const QString& page, const QString& control, const QString& comes) {
+    expectDone(finder().press(page, control));
+    if (!comes.isEmpty())
+        waitFor(comes);
+}
+
+void Walk::choose(const QString& page, const QString& control, const QString& row) {
+    expectDone(finder().choose(page, control, row));
+}
+
+void Walk::tick(const QString& page, const QString& control) {
+    expectDone(finder().tick(page, control, true));
+}
+
+void Walk::activate() {
+    m_program->window().activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&m_program->window()));
+}
+
+void Walk::key(Qt::Key code) {
+    QWidget* target = QApplication::focusWidget();
+    QTest::keyClick(target ? target : static_cast<QWidget*>(&m_program->window()), code);
+    settle();
+}
+
+QWidget& Walk::control(const QString& name) {
+    auto* widget = m_program->window().frontView()->findChild<QWidget*>(name);
+    if (!widget)
+        widget = m_program->window().findChild<QWidget*>(name);
+    EXPECT_TRUE(widget) << qPrintable(name);
+    return widget ? *widget : *m_program->window().frontView();
+}
+
+void Walk::pick(const QString& page, const QString& button, const DrivePath& path) {
+    m_program->dialogs().nextPick = [this, path] { return path.isEmpty() ? pictureFolder() / u"IMG_0001.jpg" : path; };
+    press(page, button);
+    m_program->dialogs().nextPick = {};
+    settle(300);
 }
 
 bool Walk::pressable(const QString& page, const QString& control) {
-    const ControlFinder finder(m_program->window());
-    return finder.visible(page, control).ok() && *finder.visible(page, control);
+    const Result<bool> visible = finder().visible(page, control);
+    return visible.ok() && *visible;
 }
 
 void Walk::type(const QString& page, const QString& control, const QString& text) {
-    const Result<void> done = ControlFinder(m_program->window()).type(page, control, text);
-    EXPECT_TRUE(done.ok()) << (done ? "" : qPrintable(done.failure().message));
-    settle();
+    expectDone(finder().type(page, control, text));
 }
 
 void Walk::waitFor(const QString& page) {
-    const ControlFinder finder(m_program->window());
-    EXPECT_TRUE(QTest::qWaitFor([&] { return finder.frontPage() == page; }, 20000))
-        << "in front: " << qPrintable(finder.frontPage()) << ", wanted: " << qPrintable(page)
+    EXPECT_TRUE(QTest::qWaitFor([&] { return finder().frontPage() == page; }, 20000))
+        << "in front: " << qPrintable(finder().frontPage()) << ", wanted: " << qPrintable(page)
         << ", boxes: " << qPrintable(m_program->dialogs().shownTexts.join(u" | "_s));
     settle();
 }
 
 void Walk::toMenu() {
-    press(u"hatchala"_s, u"Image1"_s);
-    waitFor(u"nnn"_s);
+    press(u"hatchala"_s, u"Image1"_s, u"nnn"_s);
 }
 
 void Walk::toDetails() {
@@ -223,15 +258,11 @@ void Walk::toTerms() {
 
 void Walk::toPictures() {
     press(u"nnn"_s, u"Check1"_s);
-    press(u"nnn"_s, u"Command3"_s);
-    waitFor(u"kyoskNew"_s);
+    press(u"nnn"_s, u"Command3"_s, u"kyoskNew"_s);
 }
 
 void Walk::choosePictures() {
-    m_program->dialogs().nextPick = [this] { return pictureFolder() / u"IMG_0001.jpg"; };
-    press(u"kyoskNew"_s, u"Image5"_s);
-    m_program->dialogs().nextPick = {};
-    settle(300);
+    pick(u"kyoskNew"_s, u"Image5"_s);
     for (const int cell : {0, 1, 4})
         press(u"kyoskNew"_s, u"Picture1(%1)"_s.arg(cell));
     press(u"kyoskNew"_s, u"Command12(1)"_s);
@@ -264,15 +295,16 @@ void Walk::toEditor() {
     toMenu();
     press(u"nnn"_s, u"Image1(1)"_s);
     toOptions();
-    press(u"nnn"_s, u"Option1(0)"_s);
-    press(u"nnn"_s, u"Option3(1)"_s);
+    toBorder();
     toPictures();
-    m_program->dialogs().nextPick = [this] { return pictureFolder() / u"IMG_0001.jpg"; };
-    press(u"kyoskNew"_s, u"Image5"_s);
-    m_program->dialogs().nextPick = {};
-    settle(300);
-    press(u"kyoskNew"_s, u"Picture1(0)"_s);
-    waitFor(u"tFrmNew"_s);
+    pick(u"kyoskNew"_s, u"Image5"_s);
+    press(u"kyoskNew"_s, u"Picture1(0)"_s, u"tFrmNew"_s);
+}
+
+void Walk::write(const DrivePath& path, const QByteArray& bytes) {
+    const Files& files = m_program->platform().files;
+    std::filesystem::create_directories(files.drives().toHost(path)->parent_path());
+    EXPECT_TRUE(files.writeWhole(path, bytes).ok());
 }
 
 void Walk::shot(const QString& name) {
@@ -280,9 +312,8 @@ void Walk::shot(const QString& name) {
     const QString folder = qEnvironmentVariable("LUMORA_SHOTS");
     if (folder.isEmpty())
         return;
-    const QSize size = m_program->window().size();
-    EXPECT_TRUE(
-        m_program->window().grab().save(u"%1/%2-%3x%4.png"_s.arg(folder, name).arg(size.width()).arg(size.height())));
+    const QPixmap grab = m_program->window().grab();
+    EXPECT_TRUE(grab.save(u"%1/%2-%3x%4.png"_s.arg(folder, name).arg(grab.width()).arg(grab.height())));
 }
 
 QStringList Walk::faults() {
@@ -322,7 +353,7 @@ QStringList Walk::faults() {
             if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
                 result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
         }
-        if (!foreign && button && !hasText(*button))
+        if (!foreign && button && (button->text() + button->accessibleName()).trimmed().isEmpty())
             result += u"no caption: "_s + nameOf(*widget);
         if (english && !widget->property("letterOfAnyLanguage").toBool()) {
             QString said = widget->accessibleName() + widget->accessibleDescription() + widget->toolTip();

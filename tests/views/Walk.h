@@ -16,6 +16,9 @@ namespace lumora {
 
 class Internet;
 
+// The name of the widget that has the keyboard.
+QString focusName();
+
 struct Screen {
     QSize size;
     bool english;
@@ -37,12 +40,22 @@ public:
         return static_cast<P&>(*find(id));
     }
 
-    void press(const QString& page, const QString& control);
+    // Presses, and waits for the page that comes of it.
+    void press(const QString& page, const QString& control, const QString& comes = {});
     void type(const QString& page, const QString& control, const QString& text);
+    void choose(const QString& page, const QString& control, const QString& row);
+    void tick(const QString& page, const QString& control);
     bool pressable(const QString& page, const QString& control);
     // Lets the program work until the page is in front, for some seconds at most.
     void waitFor(const QString& page);
     void settle(int milliseconds = 30);
+    // Gives the window the keyboard, and hits a key of it.
+    void activate();
+    void key(Qt::Key code);
+    // The widget of a name, on the page in front or below it; a failure where there is none.
+    QWidget& control(const QString& name);
+    // The lab's picker gives the first picture, or this one, to what the button opens.
+    void pick(const QString& page, const QString& button, const DrivePath& path = {});
 
     // From the start page to the page and step named.
     void toMenu();
@@ -56,6 +69,8 @@ public:
     // A quick order with the first picture open in the editor. The lab has frames in two categories.
     void toEditor();
 
+    // A file in a folder that is made where it is missing.
+    void write(const DrivePath& path, const QByteArray& bytes);
     // Writes the window to the folder that LUMORA_SHOTS names; without one nothing is written.
     void shot(const QString& name);
     // All that is wrong with what the window shows now: each line names the control.
@@ -63,6 +78,8 @@ public:
 
 private:
     Page* find(PageId id);
+    ControlFinder finder() { return ControlFinder(m_program->window()); }
+    void expectDone(const Result<void>& step);
     void writeFrames();
 
     QTemporaryDir m_folder;
