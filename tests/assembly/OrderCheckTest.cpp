@@ -46,32 +46,40 @@ TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
 }
 
 TEST_F(CheckingAnOrder, namesTheFileAtFault) {
-    const auto oneFault = [](const QStringList& faults, const QString& about) {
-        EXPECT_EQ(faults.size(), 1) << faults.join(u'|').toStdString();
-        EXPECT_TRUE(faults.join(u'|').contains(about)) << faults.join(u'|').toStdString();
-    };
-    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.chop(1); }), two);
-    oneFault(faultsWith(two, [](QByteArray& bytes) { bytes.replace("Dana", "Dora"); }), u"Dora"_s);
-    oneFault(faultsWith(u"!105_1234.jpp"_s, [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }),
-             u"!105_1234.jpp"_s);
-    oneFault(
-        faultsWith(log, [](QByteArray& bytes) { bytes.replace("fail_\",\"C:\\pics\\bad", "fail_\",\"C:\\pics\\bed"); }),
-        u"bad.jpg"_s);
-    EXPECT_EQ(
-        faultsWith(log, [](QByteArray& bytes) { bytes.replace("\"Shemot.TotalPics\",15", "\"Shemot.TotalPics\",16"); })
-            .size(),
-        3)
-        << "the total and the tails of both print files";
     // A print file whose picture is cut short still falls into its pieces.
     const QByteArray tail = readPrintFile(*machine.files.read(folder() / two), {56, 30})->tail;
     QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);
     picture.chop(picture.size() / 2);
-    oneFault(faultsWith(two, [&](QByteArray& bytes) { bytes = *packPrintFile(picture, {56, 30}, tail); }), two);
-
-    ASSERT_TRUE(machine.files.removeFile(folder() / two));
-    oneFault(faults(), u"two.jpg"_s);
-    ASSERT_TRUE(machine.files.removeFile(folder() / log));
-    oneFault(faults(), u"no order log"_s);
+    const QString sheet = u"!105_1234.jpp"_s;
+    const struct {
+        QString file;
+        std::function<void(QByteArray&)> change;
+        qsizetype faults;
+        QString about;
+    } cases[] = {
+        {two, [](QByteArray& bytes) { bytes.chop(1); }, 1, two},
+        {two, [](QByteArray& bytes) { bytes.replace("Dana", "Dora"); }, 1, u"Dora"_s},
+        {two,
+         [&](QByteArray& bytes) {
+             bytes = *packPrintFile(picture, {56, 30}, tail);
+         },
+         1, two},
+        {sheet, [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }, 1, sheet},
+        {log, [](QByteArray& bytes) { bytes.replace("fail_\",\"C:\\pics\\bad", "fail_\",\"C:\\pics\\bed"); }, 1,
+         u"bad.jpg"_s},
+        // The total and the tails of both print files.
+        {log, [](QByteArray& bytes) { bytes.replace("TotalPics\",15", "TotalPics\",16"); }, 3, two},
+    };
+    for (const auto& c : cases) {
+        const QStringList found = faultsWith(c.file, c.change);
+        EXPECT_EQ(found.size(), c.faults) << found.join(u'|').toStdString();
+        EXPECT_TRUE(found.join(u'|').contains(c.about)) << found.join(u'|').toStdString();
+    }
+    for (const auto& [gone, about] : {std::pair(two, u"two.jpg"_s), std::pair(log, u"no order log"_s)}) {
+        ASSERT_TRUE(machine.files.removeFile(folder() / gone));
+        EXPECT_EQ(faults().size(), 1);
+        EXPECT_TRUE(faults().join(u'|').contains(about)) << faults().join(u'|').toStdString();
+    }
 }
 
 } // namespace

@@ -69,8 +69,7 @@ TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
     album.SoogLBM = u"פוטו גדול"_s;
     album.SoogNiar = u"משי"_s;
     album.SoogKricha = u"חום"_s;
-    for (std::size_t i = 0; i < album.Tosafot2.size(); ++i)
-        album.Tosafot2[i] = QString::number(i);
+    album.Tosafot2 = {u"0"_s, u"1"_s, u"2"_s, u"3"_s, u"4"_s, u"5"_s, u"6"_s, u"7"_s, u"8"_s};
     album.KamutHorim = u"2"_s;
     album.SoogHorim = u"30/60"_s;
     const QString rule(89, u'-');
@@ -134,43 +133,32 @@ protected:
 
 TEST_F(ContactSheet, laysEveryPictureInLandscapeATurnedOneClockwise) {
     OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
-    const std::vector<SheetCell> cells = {picture("land", 400, 300), picture("port", 300, 400),
-                                          picture("square", 200, 200)};
-    sheet.drawContactSheet(cells, [](int) { return true; });
-    const QImage& image = sheet.bitmap().image();
-    // The first row lies at 81 + 80, cells every 82 pixels from 5.
-    EXPECT_TRUE(isRed(image.pixelColor(5 + 10, 161 + 30)));
-    EXPECT_TRUE(isBlue(image.pixelColor(5 + 70, 161 + 30)));
-    EXPECT_EQ(image.pixelColor(5 + 10, 160), QColor(Qt::white));
-    EXPECT_TRUE(isRed(image.pixelColor(87 + 40, 161 + 10))) << "the left side of a portrait picture comes to the top";
-    EXPECT_TRUE(isBlue(image.pixelColor(87 + 40, 161 + 50)));
-    EXPECT_TRUE(isRed(image.pixelColor(169 + 40, 161 + 10))) << "a square picture is turned too";
-    EXPECT_TRUE(isBlue(image.pixelColor(169 + 40, 161 + 70)));
-}
-
-TEST_F(ContactSheet, leavesTheCellOfAnUnreadablePictureEmptyAndGoesOn) {
-    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
-    sheet.drawContactSheet({{std::filesystem::path("/nowhere.jpg"), u"12_gone"_s}, picture("land", 400, 300)},
+    const SheetCell gone{std::filesystem::path("/nowhere.jpg"), u"12_gone"_s};
+    sheet.drawContactSheet({gone, picture("land", 400, 300), picture("port", 300, 400), picture("square", 200, 200)},
                            [](int) { return true; });
     const QImage& image = sheet.bitmap().image();
     EXPECT_EQ(image.copy(5, 161, 80, 80), OrderSheet(SheetKind::Plain, {80, 80}, Qt::white).bitmap().image());
-    EXPECT_TRUE(isRed(image.pixelColor(87 + 10, 161 + 30)));
+    // The first row lies at 81 + 80, cells every 82 pixels from 5; the left side of what is turned comes to the top.
+    for (const auto& [red, blue] : {std::pair(QPoint(87 + 10, 161 + 30), QPoint(87 + 70, 161 + 30)),
+                                    {QPoint(169 + 40, 161 + 10), QPoint(169 + 40, 161 + 50)},
+                                    {QPoint(251 + 40, 161 + 10), QPoint(251 + 40, 161 + 70)}}) {
+        EXPECT_TRUE(isRed(image.pixelColor(red))) << red.x();
+        EXPECT_TRUE(isBlue(image.pixelColor(blue))) << blue.x();
+    }
+    EXPECT_EQ(image.pixelColor(87 + 10, 160), QColor(Qt::white));
 }
 
 TEST_F(ContactSheet, endsWithItsLastCellAndWhereItIsToldTo) {
     OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
     const std::vector<SheetCell> cells(100, picture("land", 40, 30));
-    int last = -1;
-    sheet.drawContactSheet(cells, [&](int i) {
-        last = i;
-        return true;
-    });
-    EXPECT_EQ(last, sheet.capacity() - 1);
-    sheet.drawContactSheet(cells, [&](int i) {
-        last = i;
-        return i < 3;
-    });
-    EXPECT_EQ(last, 3);
+    for (const int end : {sheet.capacity() - 1, 3}) {
+        int last = -1;
+        sheet.drawContactSheet(cells, [&](int i) {
+            last = i;
+            return end != 3 || i < end;
+        });
+        EXPECT_EQ(last, end);
+    }
 }
 
 TEST_F(ContactSheet, writesTheLinesAboveThePictures) {
