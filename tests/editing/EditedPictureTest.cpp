@@ -1,8 +1,10 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/drawing/CaptionDraw.h"
+#include "imaging/drawing/Drawing.h"
 #include "imaging/scaling/Resample.h"
 #include "order/EditRecord.h"
 #include "session/SessionState.h"
+#include "support/PictureDifference.h"
 
 #include <QDir>
 #include <QTemporaryDir>
@@ -76,18 +78,8 @@ EditFields fieldsOf(const QString& record) {
     return edit;
 }
 
-// The mean difference a channel, the edges of frames and letters counted in.
-double meanDifference(const Bitmap& seen, const Bitmap& other) {
-    const Bitmap reduced = resampled(other, {seen.width(), seen.height()});
-    double sum = 0;
-    for (int y = 0; y < seen.height(); ++y) {
-        for (int x = 0; x < seen.width(); ++x) {
-            const QRgb a = seen.image().pixel(x, y);
-            const QRgb b = reduced.image().pixel(x, y);
-            sum += std::abs(qRed(a) - qRed(b)) + std::abs(qGreen(a) - qGreen(b)) + std::abs(qBlue(a) - qBlue(b));
-        }
-    }
-    return sum / (3.0 * seen.width() * seen.height());
+double differenceOf(const Bitmap& seen, const Bitmap& larger) {
+    return meanDifference(seen, resampled(larger, {seen.width(), seen.height()}));
 }
 
 TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
@@ -100,7 +92,6 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         {"lying.png", {10, 15}, "1   1   1   195150245 140 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   16760 200 170 0  0  000"},
         {"lying.png", {10, 15}, "1.3 1   0.8 360210300 90  1  0  000"},
-        {"lying.png", {10, 15}, "1   1   1   18140 780 780 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   180100999 999 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   180100225 150 0  0  ab 000000000blue"},
         {"lying.png", {13, 18}, "1.48-0.51   21370 -40 162 0  0  cd 000000000blue"},
@@ -112,10 +103,6 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         {"upright.png", {10, 15}, "1   1   1.3 27080 130 217 1  0  cd 000000000blue"},
         {"upright.png",
          {10, 15},
-         "1   1   1   180100150 225 0  0  000000000000          242 0 0 1 ddd       30 255255150200"
-         "0  0 1 DejaVu Sans                   Lumora 2024"},
-        {"upright.png",
-         {10, 15},
          "1   1   1   180100150 225 0  0  000000000000          242 0 0 1 ddd       30 255255280200"
          "0  3 0 DejaVu Sans                   Lumora 2024"},
     };
@@ -124,12 +111,12 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         const Bitmap seen = preview(given.file, edit, given.paper);
         const Bitmap full = print(given.file, edit, given.paper);
         ASSERT_FALSE(seen.isNull() || full.isNull()) << given.record;
-        EXPECT_LE(meanDifference(seen, full), 3.0) << given.record;
+        EXPECT_LE(differenceOf(seen, full), 3.0) << given.record;
     }
     // What the measure is worth: a print that is moved, turned or toned a little differently is told from the preview.
     const auto differs = [&](const char* record) {
-        return meanDifference(preview("lying.png", fieldsOf(u"1   1   1   195150245 140 0  0  000"_s)),
-                              print("lying.png", fieldsOf(QString::fromLatin1(record))));
+        return differenceOf(preview("lying.png", fieldsOf(u"1   1   1   195150245 140 0  0  000"_s)),
+                            print("lying.png", fieldsOf(QString::fromLatin1(record))));
     };
     EXPECT_GT(differs("1   1   1   195150257 140 0  0  000"), 3.0);
     EXPECT_GT(differs("1   1   1   202150245 140 0  0  000"), 3.0);
@@ -144,10 +131,10 @@ TEST_F(EditedPictureTest, aPreviewForALargerScreenIsTheSamePicture) {
     const Bitmap small = opened->render(edit, frame);
     const Bitmap large = opened->render(edit, frame, 2);
     EXPECT_EQ(large.image().size(), QSize(900, 600));
-    EXPECT_LE(meanDifference(small, large), 3.0);
+    EXPECT_LE(differenceOf(small, large), 3.0);
     EXPECT_EQ(opened->render(edit, frame).image(), small.image())
         << "what is kept for one scale leaves the other alone";
-    EXPECT_GT(meanDifference(small, opened->render(edit, std::nullopt)), 3.0) << "a frame that is taken off is gone";
+    EXPECT_GT(differenceOf(small, opened->render(edit, std::nullopt)), 3.0) << "a frame that is taken off is gone";
 }
 
 TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
@@ -237,14 +224,17 @@ TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
     EXPECT_NEAR(large.width(), small.width() * 10 / 3.0, 6);
 }
 
-TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavid) {
+TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavidOnPicturesAndSheet) {
     for (const auto& [family, drawn] : {std::pair(u"No Such Family"_s, false), std::pair(u"David"_s, true)}) {
         PictureCaption caption;
-        caption.text = u"שלום Lumora 2024"_s;
+        caption.text = u"שלום Lumora\r\n2024"_s;
         caption.family = family;
-        Bitmap paper(200, 60, Qt::white);
-        drawInk(paper, inkOf(caption, {200, 60}));
+        Bitmap paper(200, 80, Qt::white);
+        drawInk(paper, inkOf(caption, {200, 80}));
         EXPECT_EQ(!darkBox(paper).isNull(), drawn) << qPrintable(family);
+        Bitmap sheet(200, 80, Qt::white);
+        drawText(sheet, {5, 5}, caption.text, {.family = family, .pixelSize = 24});
+        EXPECT_EQ(darkBox(sheet).height() > 30, drawn) << "two lines";
     }
 }
 
@@ -277,12 +267,10 @@ TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
         drawInk(kept, inks.inkOf(caption, {300, 200}, scale));
         drawInk(fresh, inkOf(caption, {300, 200}, scale));
         // Outlines fall on 64ths of a pixel, which may round otherwise at another place.
-        int most = 0;
-        for (int y = 0; y < kept.height(); ++y) {
-            for (int x = 0; x < kept.width(); ++x)
-                most = std::max(most, std::abs(qGreen(kept.image().pixel(x, y)) - qGreen(fresh.image().pixel(x, y))));
+        for (int at = 0; at < 300 * 200; ++at) {
+            const auto green = [at](const Bitmap& paper) { return qGreen(paper.image().pixel(at % 300, at / 300)); };
+            ASSERT_NEAR(green(kept), green(fresh), 8) << "step " << i;
         }
-        EXPECT_LE(most, 8) << "step " << i;
     }
 }
 

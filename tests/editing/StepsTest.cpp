@@ -1,6 +1,9 @@
-// The steps of the editor's and its keyboard's buttons, in the fields of a record.
+// The rules of the editor and of its keyboard, without their pages.
+#include "common/AnsiCodePage.h"
 #include "editing/caption/CaptionStep.h"
+#include "editing/caption/KeyLayout.h"
 #include "editing/editor/LineFrameChoice.h"
+#include "editing/render/PicturePlacement.h"
 #include "editing/render/TextLabelPlace.h"
 #include "order/EditRecord.h"
 #include "session/SessionState.h"
@@ -75,6 +78,87 @@ TEST(TextLabelPlace, PlacesTheCaptionsBoxAndFindsTheAnchorBack) {
         EXPECT_NEAR(box.top, c.top, 1e-9);
         EXPECT_EQ(TextLabelPlace::anchorOf(box, fields), c.back) << c.vertical << ' ' << c.align;
     }
+}
+
+TEST(KeyLayout, OffersWhatTheOrderLogCanCarry) {
+    for (const auto letters : {KeyLayout::Letters::Hebrew, KeyLayout::Letters::Small, KeyLayout::Letters::Capital}) {
+        for (int key = 0; key < KeyLayout::keys; ++key) {
+            const QString text = KeyLayout::caption(key, letters);
+            ASSERT_EQ(text.size(), 1) << key;
+            EXPECT_EQ(AnsiCodePage::squeeze(text), text) << key;
+            EXPECT_NE(text, u"\""_s) << key;
+        }
+    }
+    EXPECT_TRUE(KeyLayout::caption(KeyLayout::keys, KeyLayout::Letters::Hebrew).isEmpty());
+    EXPECT_TRUE(KeyLayout::caption(-1, KeyLayout::Letters::Hebrew).isEmpty());
+}
+
+TEST(KeyLayout, LiesAsOnARealKeyboardInBothLanguages) {
+    QString latin;
+    QString capital;
+    QString hebrew;
+    for (const int key : KeyLayout::places()) {
+        latin += KeyLayout::caption(key, KeyLayout::Letters::Small);
+        capital += KeyLayout::caption(key, KeyLayout::Letters::Capital);
+        hebrew += KeyLayout::caption(key, KeyLayout::Letters::Hebrew);
+    }
+    EXPECT_EQ(latin, u"qwertyuiopasdfghjkl zxcvbnm,  "_s);
+    EXPECT_EQ(capital, latin.toUpper());
+    EXPECT_EQ(hebrew, u"  קראטוןםפשדגכעיחלךףזסבהנמצתץ,"_s);
+}
+
+TEST(PicturePlacement, SizesThePreviewByThePaperCode) {
+    struct Case {
+        const char* code;
+        PictureSize landscape;
+        PictureSize portrait;
+    };
+    const Case cases[] = {{"1015", {450, 300}, {300, 450}},
+                          {"1318", {450, 325}, {300, 415}},
+                          {"0913", {450, 311}, {300, 433}},
+                          {"3040", {450, 337}, {300, 400}},
+                          {"1521", {450, 321}, {300, 420}}};
+    for (const Case& expected : cases) {
+        const auto paper = PaperSize::ofDigits(QString::fromLatin1(expected.code));
+        ASSERT_TRUE(paper) << expected.code;
+        EXPECT_EQ(previewBox(*paper, PaperOrientation::Landscape), expected.landscape) << expected.code;
+        EXPECT_EQ(previewBox(*paper, PaperOrientation::Portrait), expected.portrait) << expected.code;
+    }
+}
+
+TEST(PicturePlacement, TakesAPictureFromPreviewToPrint) {
+    struct Case {
+        PictureSize picture;
+        int percent;
+        PictureSize work;
+    };
+    for (const Case& c :
+         {Case{{4000, 3000}, 100, {500, 375}}, Case{{4000, 3000}, 40, {200, 150}}, Case{{4000, 3000}, 210, {700, 525}},
+          Case{{3000, 4000}, 100, {375, 500}}, Case{{10000, 1}, 100, {500, 1}}})
+        EXPECT_EQ(workPictureSize(c.picture, c.percent), c.work) << c.percent;
+    EXPECT_FALSE(workPictureSize({1, 10000}, 100)) << "its work copy would fill the memory";
+
+    EditFields edit;
+    edit.ZoomPercent = 100;
+    edit.RotationCode = 180;
+    edit.PanX = 225;
+    edit.PanY = 150;
+    EXPECT_EQ(previewPlacement({500, 375}, {450, 300}, edit).zoomed(), (PictureSize{450, 337}));
+    const PrintGeometry tenFifteen = printGeometry({10, 15}, PaperOrientation::Landscape);
+    EXPECT_EQ(tenFifteen.size, (PictureSize{1500, 1000}));
+    const Placement lyingPrint = printPlacement({4000, 3000}, tenFifteen, edit);
+    EXPECT_EQ(lyingPrint.zoomed(), (PictureSize{1500, 1125}));
+    EXPECT_NEAR(lyingPrint.onPaper(0, 0).y, -62, 0.01);
+
+    edit.PanX = 150;
+    edit.PanY = 207;
+    EXPECT_EQ(previewPlacement({375, 500}, {300, 415}, edit).zoomed(), (PictureSize{311, 415}));
+    const PrintGeometry thirteenEighteen = printGeometry({13, 18}, PaperOrientation::Portrait);
+    EXPECT_EQ(thirteenEighteen.size, (PictureSize{1300, 1800}));
+    const Placement uprightPrint = printPlacement({3000, 4000}, thirteenEighteen, edit);
+    EXPECT_EQ(uprightPrint.zoomed(), (PictureSize{1350, 1800}));
+    EXPECT_NEAR(uprightPrint.onPaper(0, 0).x, -25, 0.01);
+    EXPECT_NEAR(uprightPrint.onPaper(0, 0).y, -3, 0.01);
 }
 
 } // namespace

@@ -25,9 +25,6 @@ protected:
         const Result<PictureSize> found = readPictureSize(host(path));
         return found && *found == size;
     }
-    static DrivePath sheet(const char* extension) {
-        return u"C:\\2000lumora\\!!000\\order"_path / (u"!105_1234"_s + QString::fromLatin1(extension));
-    }
 
     const Bitmap picture{20, 10, Qt::red};
     const Bitmap small{8, 6, Qt::blue};
@@ -42,28 +39,11 @@ TEST_F(SavingPictures, savesEachPictureUnderItsNameOnceTheDrawingStarted) {
         page().saveProof(small);
         EXPECT_EQ(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_path, {20, 10}), started);
         EXPECT_EQ(isPicture(u"C:\\2000lumora\\000.jpg"_path, {8, 6}), started);
-        EXPECT_EQ(isPicture(sheet(".jpp"), {20, 10}), started);
+        EXPECT_EQ(isPicture(state.transfer.OrderFolder / u"!105_1234.jpp", {20, 10}), started);
         EXPECT_EQ(machine.dialogs.messages,
                   QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
         startStatus = 0;
         chain.unload(PageId::gdisave);
-    }
-}
-
-TEST_F(SavingPictures, theSheetsNameFollowsTheSenderAndTheStation) {
-    struct Case {
-        Sender sender;
-        bool station, jpp, jpg;
-    };
-    for (const Case& c : {Case{Sender::Ftp, false, true, false}, Case{Sender::Ftp, true, true, true},
-                          Case{Sender::Http, false, false, true}, Case{Sender::Http, true, false, true}}) {
-        state.transfer.SugSheliach = c.sender;
-        state.TachanaMekomit = c.station;
-        page().saveOrderSheet(picture);
-        for (const auto& [ending, there] : {std::pair(".jpp", c.jpp), std::pair(".jpg", c.jpg)}) {
-            EXPECT_EQ(isPicture(sheet(ending), {20, 10}), there);
-            std::filesystem::remove(host(sheet(ending)));
-        }
     }
 }
 

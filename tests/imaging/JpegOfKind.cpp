@@ -26,27 +26,11 @@ QByteArray jpegOfKind(const Bitmap& picture, const JpegKind& kind) {
     info.input_components = inks ? 4 : 3;
     info.in_color_space = inks ? JCS_CMYK : JCS_RGB;
     jpeg_set_defaults(&info);
-    switch (kind.colours) {
-    case Colours::YCbCr:
-        break;
-    case Colours::Grey:
-        jpeg_set_colorspace(&info, JCS_GRAYSCALE);
-        break;
-    case Colours::Rgb:
-        jpeg_set_colorspace(&info, JCS_RGB);
-        break;
-    case Colours::Inks:
-        jpeg_set_colorspace(&info, JCS_CMYK);
+    // In the order of Colours.
+    constexpr J_COLOR_SPACE stored[] = {JCS_YCbCr, JCS_GRAYSCALE, JCS_RGB, JCS_CMYK, JCS_CMYK, JCS_YCCK};
+    jpeg_set_colorspace(&info, stored[static_cast<int>(kind.colours)]);
+    if (kind.colours == Colours::Inks)
         info.write_Adobe_marker = FALSE;
-        break;
-    case Colours::InvertedInks:
-        jpeg_set_colorspace(&info, JCS_CMYK);
-        info.write_Adobe_marker = TRUE;
-        break;
-    case Colours::InvertedYcck:
-        jpeg_set_colorspace(&info, JCS_YCCK);
-        break;
-    }
     for (int i = 0; i < info.num_components; ++i) {
         info.comp_info[i].h_samp_factor = 1;
         info.comp_info[i].v_samp_factor = 1;
@@ -80,9 +64,9 @@ QByteArray jpegOfKind(const Bitmap& picture, const JpegKind& kind) {
 
 Bitmap testPicture(int width, int height) {
     Bitmap picture(width, height, Qt::white);
-    for (int y = 0; y < height; ++y) {
-        for (int x = 0; x < width; ++x)
-            picture.image().setPixel(x, y, qRgb(40 + 180 * x / width, 60 + 150 * y / height, 200 - 120 * x / width));
+    for (int i = 0; i < width * height; ++i) {
+        const int x = i % width, y = i / width;
+        picture.image().setPixel(x, y, qRgb(40 + 180 * x / width, 60 + 150 * y / height, 200 - 120 * x / width));
     }
     QPainter painter(&picture.image());
     painter.fillRect(width / 4, height / 4, width / 4, height / 3, QColor(220, 200, 40));
