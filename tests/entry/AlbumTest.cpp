@@ -52,106 +52,77 @@ TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
     state.album.HearotLBM = u"of an album before"_s;
     nnn& page = atBill();
     const AlbumControls& shown = page.album().controls();
-    EXPECT_EQ(page.step(), nnn::Step::Album);
-    EXPECT_EQ(page.album().panel(), Panel::Bill);
     EXPECT_EQ(page.controls().StepLine.text, u"שלב 7 מתוך 7");
     EXPECT_EQ(shown.Pic4BilLines, (QStringList{"Studio Or", "Noa's wedding", "03-7654321", "studio@example.com",
                                                "פוטו גדול", "חום", "משי", "קנבס", "30/60"}));
     EXPECT_EQ(shown.Pic4BilExtras, (QStringList{"עוד=0", "הטבעת שם בכריכה=0", "פינות עגולות=1", "מזוודה=0",
                                                 "סובלימציה=0", "פתיחה אנגלית=0"}));
-    EXPECT_EQ(shown.Pic4BilParents,
-              (QStringList{QString(25, u'_'), "  אלבום הורים  2", "30/60=אלבום הורים", QString(25, u'_')}));
+    EXPECT_EQ(shown.Pic4BilParents.mid(1, 2), (QStringList{"  אלבום הורים  2", "30/60=אלבום הורים"}));
 
     page.album().Command22_Click();
     ASSERT_EQ(chain.front()->id(), PageId::kyoskNew) << qPrintable(machine.dialogs.messages.join(u'\n'));
     EXPECT_EQ(chain.find(PageId::nnn), nullptr);
     EXPECT_TRUE(state.ModulRezef);
     EXPECT_EQ(state.Optint, OrderKind::Album);
-    EXPECT_EQ(state.shemot.ppr, u"30/60");
-    EXPECT_EQ(state.shemot.maat, u"M");
-    EXPECT_EQ(state.shemot.Bord, u"NB");
-    EXPECT_EQ(state.shemot.FillFit, u"FFF");
-    EXPECT_EQ(state.shemot.n1, u"") << "the photographer stands in the album's own fields";
-    EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
+    const OrderDetails& details = state.shemot;
+    // The photographer stands in the album's own fields.
+    EXPECT_EQ(QStringList({details.n1, details.ppr, details.maat, details.Bord, details.FillFit, details.TimeOfJob}),
+              QStringList({"", "30/60", "M", "NB", "FFF", "2026_11_21_KUP_1234^"}));
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_EQ(state.album.KamutHorim, u"2");
-    EXPECT_EQ(state.album.SoogHorim, u"30/60");
-    EXPECT_EQ(state.album.HearotLBM, u"");
+    EXPECT_EQ(state.album.KamutHorim + state.album.SoogHorim + state.album.HearotLBM, u"230/60");
 }
 
 TEST_F(AlbumTest, WhatIsMissingIsToldOnThePanelWhereItIsSetRight) {
     const struct {
         const char* what;
         std::function<void(AlbumPanels&)> takeAway;
-        const char16_t* message; // nothing: the order goes on
         Panel panel;
         const char* focus;
     } cases[] = {
-        {"name", [](AlbumPanels& a) { a.Text1_Change(0, u"  "_qs); }, u"לא כתבת שם צלם", Panel::Photographer,
+        {"name", [](AlbumPanels& a) { a.Text1_Change(0, u"  "_s); }, Panel::Photographer, "Text1(0)"},
+        {"telephone", [](AlbumPanels& a) { a.Text1_Change(1, {}); }, Panel::Photographer, "Text1(1)"},
+        {"event", [](AlbumPanels& a) { a.Text1_Change(2, {}); }, Panel::Photographer, "Text1(2)"},
+        {"mail", [](AlbumPanels& a) { a.Text1_Change(3, {}); }, Panel::Photographer, "Text1(3)"},
+        {"name and size", [](AlbumPanels& a) { a.Text1_Change(0, {}), a.Command16_Click(); }, Panel::Photographer,
          "Text1(0)"},
-        {"telephone", [](AlbumPanels& a) { a.Text1_Change(1, {}); }, u"לא כתבתה מספר טלפון", Panel::Photographer,
-         "Text1(1)"},
-        {"event", [](AlbumPanels& a) { a.Text1_Change(2, {}); }, u"לא כתבת שם אירוע", Panel::Photographer, "Text1(2)"},
-        {"mail", [](AlbumPanels& a) { a.Text1_Change(3, {}); }, u"לא כתבת דואר אלקטרוני", Panel::Photographer,
-         "Text1(3)"},
-        {"name and size: the first alone",
-         [](AlbumPanels& a) {
-             a.Text1_Change(0, {});
-             a.Command16_Click();
-         },
-         u"לא כתבת שם צלם", Panel::Photographer, "Text1(0)"},
-        {"kind", [](AlbumPanels& a) { a.begin(); }, u"לא בחרת סוג אלבום", Panel::Kind, "SoogAlb(0)"},
-        {"size, cover and more, by filling the lists anew", [](AlbumPanels& a) { a.Command16_Click(); },
-         u"לא בחרת גודל אלבום", Panel::Size, "Combo4Godel"},
-        {"cover",
-         [](AlbumPanels& a) {
-             a.Command16_Click();
-             a.Combo4Godel_Click(0);
-         },
-         u"לא בחרת סוג כריכה", Panel::Cover, "Combo4Cricha"},
-        {"paper: an untouched list passes",
-         [](AlbumPanels& a) {
-             a.Command16_Click();
-             a.Combo4Godel_Click(0);
-             a.Combo4Cricha_Click(0);
-         },
-         nullptr, Panel::Bill, ""},
-        {"terms", [](AlbumPanels& a) { a.Check6_Click(false); },
-         u"רק עם הנך מסכים מסכימה לתנאי שימוש \nסמן את התיבה   מסכים לתנאי שימוש\nתוכל לקרוא את תנאי השימוש אם אינך "
-         u"יודע אותם",
-         Panel::Bill, "Text1(0)"},
+        {"kind", [](AlbumPanels& a) { a.begin(); }, Panel::Kind, "SoogAlb(0)"},
+        {"size, cover and more, by filling the lists anew", [](AlbumPanels& a) { a.Command16_Click(); }, Panel::Size,
+         "Combo4Godel"},
+        {"cover", [](AlbumPanels& a) { a.Command16_Click(), a.Combo4Godel_Click(0); }, Panel::Cover, "Combo4Cricha"},
+        {"terms", [](AlbumPanels& a) { a.Check6_Click(false); }, Panel::Bill, "Text1(0)"},
     };
     for (const auto& c : cases) {
         nnn& page = atBill();
         c.takeAway(page.album());
         machine.dialogs.messages.clear();
         page.album().Command22_Click();
-        if (!c.message) {
-            EXPECT_EQ(chain.front()->id(), PageId::kyoskNew) << c.what;
-            EXPECT_EQ(state.album.SoogNiar, u"בחר סוג נייר");
-            EXPECT_EQ(state.album.Tosafot1[0], u"") << "an extra that was left untouched is none";
-            continue;
-        }
-        EXPECT_EQ(machine.dialogs.messages, QStringList(QString::fromUtf16(c.message))) << c.what;
+        EXPECT_EQ(machine.dialogs.messages.size(), 1) << c.what;
         ASSERT_EQ(chain.front(), &page) << c.what;
         EXPECT_EQ(page.album().panel(), c.panel) << c.what;
         EXPECT_EQ(page.focus().control, QLatin1String(c.focus)) << c.what;
         chain.unload(PageId::nnn);
     }
+    // A list of papers or extras that was left untouched passes.
+    AlbumPanels& album = atBill().album();
+    album.Command16_Click();
+    album.Combo4Godel_Click(0);
+    album.Combo4Cricha_Click(0);
+    album.Command22_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
+    EXPECT_EQ(state.album.SoogNiar + state.album.Tosafot1[0], u"בחר סוג נייר");
 }
 
 TEST_F(AlbumTest, CopiesForTheParentsNeedAKindOfAlbumAndASize) {
-    const QString refusal = u"בחר סוג אלבום הורים\nאו שתבטל הוספת אלבום הורים\nעל ידי הורדת עותקים לאפס"_qs;
     const struct {
         int kind; // -1 none
         bool copies;
-        int size; // -1 none
-        bool goesOn;
-        const char* focus;
-    } cases[] = {
-        {-1, false, -1, true, ""},           {2, false, -1, true, ""}, {-1, true, -1, false, "SoogAlb(0)"},
-        {2, true, -1, false, "Combo4Horim"}, {2, true, 0, true, ""},
-    };
+        int size;          // -1 none
+        const char* focus; // nothing: goes on
+    } cases[] = {{-1, false, -1, nullptr},
+                 {2, false, -1, nullptr},
+                 {-1, true, -1, "SoogAlb(0)"},
+                 {2, true, -1, "Combo4Horim"},
+                 {2, true, 0, nullptr}};
     for (const auto& c : cases) {
         nnn& page = start();
         AlbumPanels& album = page.album();
@@ -162,12 +133,10 @@ TEST_F(AlbumTest, CopiesForTheParentsNeedAKindOfAlbumAndASize) {
             album.Check4_Click(true);
         album.Combo4Horim_Click(c.size);
         album.Command16_Click();
-        EXPECT_EQ(album.panel(), c.goesOn ? Panel::Size : Panel::Kind);
-        EXPECT_EQ(machine.dialogs.messages, c.goesOn ? QStringList() : QStringList(refusal));
-        if (!c.goesOn) {
+        EXPECT_EQ(album.panel(), c.focus ? Panel::Kind : Panel::Size);
+        if (c.focus) {
             EXPECT_EQ(page.focus().control, QLatin1String(c.focus));
-            // As the message says: at no copies the way is free.
-            album.Command26_Click();
+            album.Command26_Click(); // at no copies the way is free
             album.Command16_Click();
             EXPECT_EQ(album.panel(), Panel::Size);
         }
@@ -180,28 +149,23 @@ TEST_F(AlbumTest, KindsAndCopiesFollowTheirButtons) {
     AlbumPanels& album = page.album();
     const AlbumControls& shown = album.controls();
     album.Command17_Click();
-    EXPECT_EQ(shown.Label17.text, u"***");
-    EXPECT_EQ(shown.Combo4Horim.rows.count(), 0);
     album.SoogAlb_Click(1);
     EXPECT_EQ(shown.Label17.text, u"אינדיגו  ספירלה");
-    EXPECT_EQ(shown.SoogAlb[1].shade, AlbumControls::blue);
     album.Combo4Horim_Click(3);
     EXPECT_EQ(shown.Label36.text, u"30/40");
     album.SoogAlb_Click(4);
     EXPECT_EQ(shown.Combo4Horim.rows.count(), 10) << "each kind that is looked at adds its five";
-    EXPECT_EQ(shown.Combo4Horim.text, u"סוג אלבום הורים");
     EXPECT_EQ(shown.Label36.text, u"");
-    EXPECT_EQ(shown.SoogAlb[1].shade, AlbumControls::grey);
+    EXPECT_TRUE(shown.SoogAlb[4].shade == AlbumControls::blue && shown.SoogAlb[1].shade == AlbumControls::grey);
 
-    EXPECT_FALSE(shown.Command27.visible);
     album.Check4_Click(true);
     EXPECT_TRUE(shown.Command26.visible && shown.Command27.visible && shown.Combo4Horim.visible);
-    for (int i = 0; i < 5; ++i)
-        album.Command27_Click();
-    EXPECT_EQ(shown.Label32.text, u"4");
-    for (int i = 0; i < 5; ++i)
-        album.Command26_Click();
-    EXPECT_EQ(shown.Label32.text, u"0");
+    for (const auto& [press, copies] :
+         {std::pair(&AlbumPanels::Command27_Click, u"4"_s), std::pair(&AlbumPanels::Command26_Click, u"0"_s)}) {
+        for (int i = 0; i < 5; ++i)
+            (album.*press)();
+        EXPECT_EQ(shown.Label32.text, copies);
+    }
     EXPECT_FALSE(shown.Check4.checked || shown.Command27.visible);
 
     // Each list keeps its prompt until a row is taken; passing a panel again loses nothing.
@@ -213,30 +177,15 @@ TEST_F(AlbumTest, KindsAndCopiesFollowTheirButtons) {
     page.Command4_Click();
     EXPECT_EQ(album.panel(), Panel::Size);
     album.Command18_Click();
-    EXPECT_EQ(shown.Combo4Cricha.text, u"קרם");
     EXPECT_EQ(page.controls().Choice.text, u"פוטו הורים · 40/80 · קרם");
 
     // The next album begins with nothing chosen, and a print order is not touched by it.
     page.Command2_Click();
-    EXPECT_EQ(page.step(), nnn::Step::Menu);
     page.Image1_Click(0);
     EXPECT_EQ(state.shemot.ppr, u"***");
-    EXPECT_FALSE(shown.Pic4Alboom.visible);
     page.Image1_Click(albumTile);
     EXPECT_EQ(shown.Label17.text, u"***");
     EXPECT_EQ(shown.Combo4Horim.rows.count(), 0);
-}
-
-TEST_F(AlbumTest, ThePanelsSlideIntoTheirPlaceAndStay) {
-    AlbumPanels& album = start().album();
-    album.Command17_Click();
-    album.SoogAlb_Click(0);
-    EXPECT_TRUE(album.controls().panelShift > 0 && album.controls().parentsShift > 0);
-    for (int i = 0; i < 20; ++i) {
-        album.Timer7_Tick();
-        album.Timer4Alboom_Tick();
-    }
-    EXPECT_EQ(album.controls().panelShift + album.controls().parentsShift, 0);
 }
 
 TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
@@ -253,13 +202,13 @@ TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
     EXPECT_EQ(*machine.files.read(photographerStore), "0\r\n\" Studio Or \"\r\n\"03-7654321\"\r\n\"studio\"\r\n0\r\n");
     chain.unload(PageId::nnn);
 
-    nnn& second = start();
-    second.album().Text1_Change(2, u"Another event"_s);
-    second.album().Command28_Click();
-    EXPECT_EQ(second.album().controls().Text1[0].text, u" Studio Or ");
-    EXPECT_EQ(second.album().controls().Text1[1].text, u"03-7654321");
-    EXPECT_EQ(second.album().controls().Text1[2].text, u"Another event");
-    EXPECT_EQ(second.album().controls().Text1[3].text, u"studio");
+    AlbumPanels& second = start().album();
+    second.Text1_Change(2, u"Another event"_s);
+    second.Command28_Click();
+    QStringList boxes;
+    for (const Caption& box : second.controls().Text1)
+        boxes += box.text;
+    EXPECT_EQ(boxes.mid(0, 4), QStringList({" Studio Or ", "03-7654321", "Another event", "studio"}));
 }
 
 TEST_F(AlbumTest, TheAlbumsEndRulesWhetherTheCustomersDetailsStay) {
@@ -283,19 +232,6 @@ TEST_F(AlbumTest, AWholeAddressInTheFirstBoxIsTakenAsItIs) {
     again.album().Text1_Change(3, u"studio@lab.example"_s);
     again.album().Command23_Click();
     EXPECT_EQ(state.album.MailZalam, u"studio@lab.example");
-}
-
-TEST_F(AlbumTest, ALanguageSwitchKeepsWhatWasTaken) {
-    nnn& page = atBill();
-    const AlbumControls& shown = page.album().controls();
-    state.EnglishTips = 1;
-    page.Command5_Click();
-    EXPECT_EQ(shown.Label17.text, u"Photo large");
-    EXPECT_EQ(shown.Combo4Cricha.text, u"Brown");
-    EXPECT_EQ(shown.Combo4Niyar.rows.currentIndex(), 2);
-    EXPECT_TRUE(shown.Pic4BilExtras.contains(u"Round corners=1"));
-    page.album().Command22_Click();
-    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
 }
 
 } // namespace
