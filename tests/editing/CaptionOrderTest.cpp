@@ -59,10 +59,11 @@ void expectOrder(const char* what, const Draw& draw) {
     const auto forced = [&](const QString& text) { return drawn(draw, u'\u202D' + text + u'\u202C'); };
     for (const auto& [text, fromTheLeft] : cases) {
         const Bitmap line = drawn(draw, text);
-        EXPECT_LT(difference(line, forced(fromTheLeft)), 0.3) << what << ": " << qPrintable(text);
+        const double right = difference(line, forced(fromTheLeft));
+        EXPECT_LT(right, 0.1) << what << ": " << qPrintable(text);
         for (const QString& wrong : {text, reversed(text), reversed(fromTheLeft)}) {
             if (wrong != fromTheLeft) {
-                EXPECT_GT(difference(line, forced(wrong)), 0.4) << what << ": " << qPrintable(text);
+                EXPECT_GT(difference(line, forced(wrong)), right + 0.1) << what << ": " << qPrintable(text);
             }
         }
     }

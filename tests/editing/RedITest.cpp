@@ -257,7 +257,7 @@ TEST_F(RedEyePage, WorksAtTheSmallestSizeAtTheEdgeAndPartlyOutside) {
         }
         page.Image5_Click();
         page.Command3_Click(); // by hand, round the middle
-        EXPECT_EQ(RedEye::redness(image(page).pixel(leftEye)) < 20, at == leftEye);
+        EXPECT_TRUE(at != leftEye || RedEye::redness(image(page).pixel(leftEye)) < 20);
         page.Image7_Click();
         page.Image5_Click();
         EXPECT_EQ(image(page), original);
