@@ -73,7 +73,8 @@ public:
             m_cut = true;
             return cut();
         }
-        const std::optional<QByteArray> stored = m_lab.stores ? m_lab.stores(remoteName, *content) : *content;
+        const std::optional<QByteArray> stored =
+            m_lab.stores ? m_lab.stores(remoteName, *content) : std::optional<QByteArray>(*content);
         if (stored)
             m_lab.folders[m_here][remoteName] = *stored;
         return {};
