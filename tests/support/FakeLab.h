@@ -68,9 +68,6 @@ public:
     Result<QByteArray> fetch(const QString& url) override;
     void abort() override { ++aborts; }
 
-    // True as often as the counter says.
-    static bool strikes(int& counter);
-
     DataChannel lastChannel = DataChannel::Passive;
 };
 
