@@ -1,11 +1,17 @@
 #include "assembly/Preparation.h"
 
+#include "assembly/edited/KeptWork.h"
+#include "order/BasketLine.h"
 #include "order/PrintCode.h"
+#include "order/PrintFile.h"
+#include "order/PrintFileName.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
+
+#include <utility>
 
 namespace lumora {
 
@@ -24,6 +30,24 @@ void Preparation::begin(const QStringList& lines) {
     count(m_lines);
 }
 
+void Preparation::takeHandOver() {
+    m_replaced = std::exchange(m_state.handOver.replaced, {});
+    const DrivePath goesOn = std::exchange(m_state.handOver.takenUp, {});
+    const DrivePath& before = goesOn.isEmpty() ? m_replaced : goesOn;
+    if (before.isEmpty())
+        return;
+    const Workspace workspace(m_state, m_platform.files);
+    QString number = m_state.MisparHazmana; // the order has its own
+    if (workspace.MakeWorkspace())
+        static_cast<void>(workspace.CleanWorkspace(number));
+    KeptWork(m_state, m_platform.files, OrderFolder(before)).bringBack();
+    if (goesOn.isEmpty())
+        return;
+    m_goesOn = true;
+    m_folder = OrderFolder(goesOn);
+    m_state.transfer.OrderFolder = goesOn;
+}
+
 bool Preparation::claimFolder(OrderFolder::Ending ending, Sender by) {
     if (const Result<void> ready = readyFolder(ending); !ready) {
         m_events.notWritten(PreparationEvents::NotWritten::Folder, ready.failure());
@@ -32,24 +56,54 @@ bool Preparation::claimFolder(OrderFolder::Ending ending, Sender by) {
     const OrderState::Way way = m_state.TachanaMekomit ? OrderState::Way::Station
                                 : by == Sender::Http   ? OrderState::Way::Http
                                                        : OrderState::Way::Ftp;
-    m_journal.emplace(m_platform.files, *m_folder);
-    keep(m_journal->begin(m_state, way, m_lines));
+    keep(m_journal->begin(m_state, way, m_lines, m_replaced));
     return true;
 }
 
 Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
     const Files& files = m_platform.files;
+    m_there.clear();
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
-        for (const QString& name : files.names(m_folder->path(), u"*.jpp"_s))
-            static_cast<void>(files.removeFile(m_folder->filePath(name)));
+        m_journal.emplace(files, *m_folder);
+        if (m_goesOn && m_journal->state().items == m_lines)
+            findPrints();
+        else
+            removePrints();
+        if (const QString replaces = m_journal->state().replaces; !replaces.isEmpty())
+            m_replaced = m_folder->path().folder() / replaces;
         return makeOrderFolder(files, *m_folder); // it may have been removed meanwhile
     }
     const Result<OrderFolder> claimed = claimOrderFolder(m_state, files, ending);
     if (!claimed)
         return claimed.failure();
     m_folder = *claimed;
+    m_journal.emplace(files, *m_folder);
     m_state.transfer.OrderFolder = claimed->path();
     return {};
+}
+
+// All prints of an order have one shape, and the lab's settings may have changed meanwhile.
+void Preparation::findPrints() {
+    const LineForm form = lineFormOf(m_state.Optint);
+    for (int i = 0; i < m_lines.size(); ++i) {
+        const BasketLine line = BasketLine::split(m_lines[i], form);
+        const DrivePath print = m_folder->filePath(PrintNameOf(line, i, m_state.Optint));
+        if (!line.hasUsableName() || !m_platform.files.fileExists(print))
+            continue;
+        if (m_there.isEmpty()) {
+            const Result<QByteArray> bytes = m_platform.files.read(print);
+            if (!bytes || !readPrintFile(*bytes, PrintFileShape::of(m_state.profile))) {
+                removePrints();
+                return;
+            }
+        }
+        m_there += i;
+    }
+}
+
+void Preparation::removePrints() const {
+    for (const QString& name : m_platform.files.names(m_folder->path(), u"*.jpp"_s))
+        static_cast<void>(m_platform.files.removeFile(m_folder->filePath(name)));
 }
 
 // An order without its state can be sent all the same; it only can't be taken up again.
@@ -121,7 +175,18 @@ bool Preparation::writeLog(OrderLog::Layout layout) {
     }
     m_state.transfer.OrderLogBase = m_folder->logBase();
     keep(m_journal->prepared());
+    removeWhatIsNotNeeded();
     return true;
+}
+
+// The replaced order's number is another's on the server; a station's order goes nowhere and needs no second making.
+void Preparation::removeWhatIsNotNeeded() const {
+    const Files& files = m_platform.files;
+    if (!m_replaced.isEmpty() && files.folderExists(m_replaced) && m_replaced != m_folder->path())
+        static_cast<void>(files.removeTree(m_replaced)); // the next start tries again
+    const DrivePath kept = m_folder->filePath(u".kept"_s);
+    if (m_journal->state().way == OrderState::Way::Station && files.folderExists(kept))
+        static_cast<void>(files.removeTree(kept)); // hidden, and never sent
 }
 
 } // namespace lumora

@@ -6,6 +6,7 @@
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 
+#include <QSet>
 #include <QStringList>
 
 #include <functional>
@@ -50,20 +51,28 @@ public:
         , m_platform(platform)
         , m_events(events) {}
 
+    // Takes from the hand-over which unfinished order goes on, or which order this one is prepared again from.
+    void takeHandOver();
+    bool goesOn() const { return m_goesOn; }
     // Sets TotalPics, the sum of the copies.
     void count(const QStringList& lines);
 
 protected:
     void begin(const QStringList& lines);
     // Claims a free order number by making its folder, and names that folder to the senders. A second start keeps both
-    // and removes the print files of the first. by: the sender that the order is made for. False when the folder can't
+    // and removes the print files of the first. An order that goes on keeps its print files too, as long as its basket
+    // and the shape of print files are the same. by: the sender that the order is made for. False when the folder can't
     // be made.
     bool claimFolder(OrderFolder::Ending ending, Sender by);
     // Calls step(i) and yields for each line. False when a click ended the program.
     bool forEachPicture(const std::function<void(int)>& step);
+    // True for a line whose print the order has from before.
+    bool isThere(int index) const { return m_there.contains(index); }
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
     void notPrepared(const DrivePath& picture);
     void notWritten(const Failure& failure);
+    // Tells of what is kept for going on with the order: it can be sent without.
+    void keep(const Result<void>& written);
     // No value when a click ended the program.
     std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines, const QStringList& texts,
                                     const std::vector<SheetCell>& cells);
@@ -77,14 +86,19 @@ protected:
     PreparationEvents& m_events;
     QStringList m_lines;
     std::optional<OrderFolder> m_folder; // set by claimFolder()
+    QSet<int> m_there;                   // indices of the lines whose print is there
 
 private:
     Result<void> readyFolder(OrderFolder::Ending ending);
-    void keep(const Result<void>& written);
+    void findPrints();
+    void removePrints() const;
+    void removeWhatIsNotNeeded() const;
 
     std::optional<OrderJournal> m_journal; // of m_folder
     QStringList m_failed;                  // paths of the pictures that could not be prepared
     int m_writeFailures = 0;
+    bool m_goesOn = false;
+    DrivePath m_replaced; // folder of the order that this one is prepared again from, or empty
 };
 
 } // namespace lumora

@@ -126,9 +126,11 @@ QByteArray OrderState::write() const {
         writer.text(u"InHand"_s, path);
     if (!replaces.isEmpty())
         writer.text(u"Replaces"_s, replaces);
-    if (phase <= Phase::Prepared) {
+    if (phase < Phase::Reported) {
         for (const auto& [key, value] : choices)
             writer.text(choicePrefix + key, value);
+    }
+    if (phase <= Phase::Prepared) {
         for (const QString& item : items)
             writer.text(u"Shoora"_s, item);
     }

@@ -37,8 +37,8 @@ struct OrderState {
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;
     QString replaces;               // folder name of the order that this one was prepared again from
-    QStringList items;              // lines of the basket; kept until the sending begins, like the choices
-    QList<ListOutputEntry> choices; // as OrderChoices has them
+    QStringList items;              // lines of the basket; kept until the sending begins
+    QList<ListOutputEntry> choices; // as OrderChoices has them; kept until the lab was told
     QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
 
     bool operator==(const OrderState&) const = default;

@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/FixedText.h"
+#include "order/BasketLine.h"
 #include "order/PrintCode.h"
 
 #include <QRegularExpression>
@@ -31,6 +32,10 @@ int PrintFileName::copies() const {
 
 QString PrintBaseName(const DrivePath& path) {
     return RightPart(path.stem(), 20);
+}
+
+QString PrintNameOf(const BasketLine& line, int index, OrderKind kind) {
+    return PrintFileName{line.code, index, static_cast<int>(kind), PrintBaseName(line.path)}.text();
 }
 
 } // namespace lumora

@@ -4,9 +4,13 @@
 
 #include <QString>
 
+#include <cstdint>
 #include <optional>
 
 namespace lumora {
+
+struct BasketLine;
+enum class OrderKind : std::int16_t;
 
 // The name of a print file: print code, number of the basket line, kind of order, and the picture's own name in
 // hexadecimal, so that a Hebrew name survives the transfer and the lab's file system.
@@ -27,5 +31,8 @@ struct PrintFileName {
 
 // The base name in names and tails: the last 20 characters of the file name without its last four.
 QString PrintBaseName(const DrivePath& path);
+
+// The name of the print file of a basket line; index counts from 0.
+QString PrintNameOf(const BasketLine& line, int index, OrderKind kind);
 
 } // namespace lumora

@@ -24,6 +24,7 @@ B3::B3(SessionState& state, const Platform& platform, PageChain& chain)
 B3::~B3() = default;
 
 void B3::load() {
+    m_preparation.takeHandOver();
     takeLines();
     for (const QString& item : List1.items())
         List2.append(LeafName(item));

@@ -3,6 +3,7 @@
 #include "common/FixedText.h"
 #include "imaging/files/BmpFile.h"
 #include "order/EditRecord.h"
+#include "order/PrintFile.h"
 #include "order/PrintFileName.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -26,6 +27,10 @@ EditedPreparation::EditedPreparation(SessionState& state, const Platform& platfo
     : Preparation(state, platform, events)
     , m_jobFolder(WorkspacePaths::jobFolder(state)) {}
 
+KeptWork EditedPreparation::kept() const {
+    return {m_state, m_platform.files, *m_folder};
+}
+
 void EditedPreparation::makeJobFolder() const {
     for (const DrivePath& path : {WorkspacePaths::root(m_state), WorkspacePaths::zmany(m_state), m_jobFolder}) {
         if (!m_platform.files.folderExists(path))
@@ -37,9 +42,10 @@ bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSiz
     begin(lines);
     if (!claimFolder(OrderFolder::Ending::Plain, m_state.transfer.SugSheliach))
         return false;
+    keep(kept().keepCorrected(m_lines));
     PrintPacker packer(m_state, m_platform.files, *m_folder, OrderTail::shortWidth);
     {
-        EditedPrints prints(m_state, m_platform.files, m_lines, paper);
+        EditedPrints prints(m_state, m_platform.files, m_lines, m_there, paper);
         if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
             return false;
     }
@@ -56,6 +62,11 @@ void EditedPreparation::preparePicture(int index, PrintPacker& packer, EditedPri
     if (!line.hasUsableName())
         return;
     m_events.inWork(line.path);
+    if (isThere(index)) {
+        remakeThumbnail(index, line, packer.scratch());
+        packer.removeScratch();
+        return;
+    }
     if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
         saveThumbnail(line, packer.scratch());
     packer.removeScratch();
@@ -84,10 +95,26 @@ Result<void> EditedPreparation::keepToneCopy(const BasketLine& line, NewContent&
     return m_platform.files.copyFile(path, WorkspacePaths::corrected(m_state, path));
 }
 
+// A kill may have come between print and thumbnail.
+void EditedPreparation::remakeThumbnail(int index, const BasketLine& line, const DrivePath& scratch) {
+    if (m_platform.files.fileExists(thumbnailPath(line)))
+        return;
+    const Result<QByteArray> bytes =
+        m_platform.files.read(m_folder->filePath(PrintNameOf(line, index, OrderKind::EditedPrint)));
+    const Result<PrintFileContent> print =
+        bytes ? readPrintFile(*bytes, PrintFileShape::of(m_state.profile)) : Result<PrintFileContent>(bytes.failure());
+    if (print && m_platform.files.writePassing(scratch, print->picture))
+        saveThumbnail(line, scratch);
+}
+
+DrivePath EditedPreparation::thumbnailPath(const BasketLine& line) const {
+    return m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + u".bmp"_s);
+}
+
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
 void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& scratch) {
     const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
-    const DrivePath path = m_jobFolder / (line.copiesField() + u'~' + PrintBaseName(line.path) + u".bmp"_s);
+    const DrivePath path = thumbnailPath(line);
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
     const Result<PictureSize> size =
         source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch.text()};
@@ -101,7 +128,8 @@ void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& s
     NewContent thumbnail(*target, path.text());
     appendBmp(*preview, thumbnail, [] { return false; });
     // Without a thumbnail the picture's cell of the sheet stays empty.
-    static_cast<void>(thumbnail.commit(NewContent::Durability::Passing));
+    if (thumbnail.commit(NewContent::Durability::Passing))
+        keep(kept().keepThumbnail(path));
 }
 
 std::optional<Bitmap> EditedPreparation::drawSheet() {

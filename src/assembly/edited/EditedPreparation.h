@@ -2,6 +2,7 @@
 
 #include "assembly/Preparation.h"
 #include "assembly/edited/EditedPrints.h"
+#include "assembly/edited/KeptWork.h"
 
 namespace lumora {
 
@@ -20,6 +21,9 @@ private:
     void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
     Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
     Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
+    KeptWork kept() const;
+    DrivePath thumbnailPath(const BasketLine& line) const;
+    void remakeThumbnail(int index, const BasketLine& line, const DrivePath& scratch);
     void saveThumbnail(const BasketLine& line, const DrivePath& scratch);
     std::optional<Bitmap> drawSheet();
 

@@ -4,6 +4,7 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/files/BmpFile.h"
 #include "order/EditRecord.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
@@ -38,13 +39,13 @@ EditedPrintResult render(EditedPrint print, const EditFields& edit, const fs::pa
 } // namespace
 
 EditedPrints::EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
-                           std::optional<PaperSize> paper)
+                           const QSet<int>& there, std::optional<PaperSize> paper)
     : m_state(state)
     , m_files(files)
     , m_paper(paper) {
-    for (const QString& text : items) {
-        BasketLine item = BasketLine::split(text, LineForm::Full);
-        if (item.hasUsableName())
+    for (int i = 0; i < items.size(); ++i) {
+        BasketLine item = BasketLine::split(items[i], LineForm::Full);
+        if (!there.contains(i) && item.hasUsableName())
             m_items.push_back(std::move(item));
     }
     m_ahead = std::make_unique<Ahead>(static_cast<int>(m_items.size()),
@@ -55,8 +56,7 @@ EditedPrints::Ahead::Work EditedPrints::rendering(const BasketLine& item) const 
     EditFields edit;
     UnpackEditState(item.editState, edit);
     const Drives& drives = m_files.drives();
-    const DrivePath source =
-        edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(m_state, item.path) : item.path;
+    const DrivePath source = PictureOf(item, LineForm::Full, m_state);
     const std::optional<HostPath> file = HasQuestionMark(source.text()) ? std::nullopt : drives.toHost(source);
     const std::optional<HostPath> copy = drives.toHost(WorkspacePaths::toneCopy(m_state));
     if (!m_paper || !file || !copy)

@@ -7,6 +7,7 @@
 #include "order/BasketLine.h"
 
 #include <QByteArray>
+#include <QSet>
 #include <QStringList>
 
 #include <memory>
@@ -26,13 +27,13 @@ struct EditedPrintResult {
     std::unique_ptr<NewContent> toneCopy = {};
 };
 
-// The prints of an edited order, rendered ahead of the steps that pack them, one for each line with a usable name. Only
-// values go into that work. A line that is marked "RED" is rendered from the corrected copy, and a missing copy is a
-// failure, since the customer did not see the uncorrected picture.
+// The prints of an edited order, rendered ahead of the steps that pack them, one for each line with a usable name whose
+// print is not there. Only values go into that work. A line that is marked "RED" is rendered from the corrected copy,
+// and a missing copy is a failure, since the customer did not see the uncorrected picture.
 class EditedPrints {
 public:
-    // items as List1 holds them. Without a paper every print is a failure.
-    EditedPrints(const SessionState& state, const Files& files, const QStringList& items,
+    // items as List1 holds them; there: indices of those that have a print. Without a paper every print is a failure.
+    EditedPrints(const SessionState& state, const Files& files, const QStringList& items, const QSet<int>& there,
                  std::optional<PaperSize> paper);
 
     // The next print in the order of the list; calls whileWaiting again and again until it is there.

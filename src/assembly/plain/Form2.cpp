@@ -17,6 +17,7 @@ Form2::Form2(SessionState& state, const Platform& platform, PageChain& chain)
 Form2::~Form2() = default;
 
 void Form2::load() {
+    m_preparation.takeHandOver();
     if (takeLines())
         QTimer::singleShot(0, this, &Form2::start);
     Command4.visible = m_preparation.isAlbum();
@@ -92,8 +93,10 @@ void Form2::choose(int index) {
     Q_EMIT changed();
 }
 
+// The basket of an order that goes on has been through this.
 void Form2::keepOnlyJpeg() {
-    PlainPreparation::keepOnlyJpeg(List1, List4removed);
+    if (!m_preparation.goesOn())
+        PlainPreparation::keepOnlyJpeg(List1, List4removed);
     showProgress();
     Q_EMIT changed();
 }

@@ -34,10 +34,10 @@ bool isJpegItem(const QString& item) {
 // gives bytes; it shares no state with the page.
 class PlainPreparation::Prints {
 public:
-    Prints(const SessionState& state, const Files& files, const QStringList& items)
+    Prints(const SessionState& state, const Files& files, const QStringList& items, const QSet<int>& there)
         : m_files(files)
         , m_paper(PaperSize::ofText(state.shemot.ppr))
-        , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items))
+        , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items, there))
         , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
 
     template <class Waiting>
@@ -48,11 +48,11 @@ public:
 private:
     using Ahead = WorkAhead<Result<QByteArray>>;
 
-    static QList<DrivePath> sourcesToScale(const QStringList& items) {
+    static QList<DrivePath> sourcesToScale(const QStringList& items, const QSet<int>& there) {
         QList<DrivePath> sources;
-        for (const QString& item : items) {
-            const BasketLine picture = split(item);
-            if (picture.hasUsableName() && !HasQuestionMark(item))
+        for (int i = 0; i < items.size(); ++i) {
+            const BasketLine picture = split(items[i]);
+            if (!there.contains(i) && picture.hasUsableName() && !HasQuestionMark(items[i]))
                 sources += picture.path;
         }
         return sources;
@@ -101,21 +101,30 @@ bool PlainPreparation::prepare(const QStringList& lines) {
     // The sheet shows the number.
     if (!claimFolder(OrderFolder::Ending::BySession, Sender::Ftp))
         return false;
-    const std::optional<Bitmap> drawn = drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain, m_lines);
-    if (!drawn)
+    if (!makeSheet())
         return false;
-    const DrivePath sheetPath = m_folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, u".jpp"_s));
-    const Result<QByteArray> sheet = encodeJpeg(*drawn, printQuality);
-    const Result<void> saved = sheet ? m_platform.files.writeWhole(sheetPath, *sheet) : Result<void>(sheet.failure());
-    if (!saved)
-        notWritten(saved.failure());
 
     PrintPacker packer(m_state, m_platform.files, *m_folder, m_state.SugTzad);
-    Prints prints(m_state, m_platform.files, m_lines);
+    Prints prints(m_state, m_platform.files, m_lines, m_there);
     if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
         return false;
     countOrder();
     return writeLog(isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
+}
+
+// The sheet of an order that goes on shows pictures that may be gone by now: one that is there stays.
+bool PlainPreparation::makeSheet() {
+    const DrivePath path = m_folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, u".jpp"_s));
+    if (!m_there.isEmpty() && m_platform.files.fileExists(path))
+        return true;
+    const std::optional<Bitmap> drawn = drawSheet(isAlbum() ? SheetKind::Album : SheetKind::Plain, m_lines);
+    if (!drawn)
+        return false;
+    const Result<QByteArray> sheet = encodeJpeg(*drawn, printQuality);
+    const Result<void> saved = sheet ? m_platform.files.writeWhole(path, *sheet) : Result<void>(sheet.failure());
+    if (!saved)
+        notWritten(saved.failure());
+    return true;
 }
 
 void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& prints) {
@@ -129,6 +138,8 @@ void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& print
         return;
     }
     m_events.inWork(line.path);
+    if (isThere(index))
+        return;
     pack(packer, {index, line.code, line.path}, [&] {
         return m_state.DchisaAmoka == 1 ? m_platform.files.read(line.path)
                                         : prints.next([this] { m_platform.pump.pump(); });

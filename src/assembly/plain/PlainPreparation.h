@@ -24,6 +24,7 @@ public:
 private:
     class Prints;
 
+    bool makeSheet(); // false when a click ended the program
     void packPicture(int index, PrintPacker& packer, Prints& prints);
 };
 

@@ -1,0 +1,174 @@
+#include "order/UnfinishedOrders.h"
+
+#include "common/FixedText.h"
+#include "order/BasketLine.h"
+#include "order/EditRecord.h"
+#include "order/FinishedOrder.h"
+#include "order/OrderChoices.h"
+#include "order/OrderCompleteness.h"
+#include "order/OrderDetailsReader.h"
+#include "order/OrderNames.h"
+#include "order/PrintFileName.h"
+#include "platform/files/Files.h"
+#include "session/SessionState.h"
+#include "session/Workspace.h"
+
+#include <unistd.h>
+
+#include <algorithm>
+#include <utility>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+using Phase = OrderState::Phase;
+using Way = OrderState::Way;
+
+namespace {
+
+// The system removes a folder in this way only if it holds nothing, hidden files included.
+void removeIfEmpty(const Files& files, const DrivePath& folder) {
+    if (const Result<HostPath> host = files.host(folder))
+        static_cast<void>(::rmdir(host->c_str()));
+}
+
+// A corrected copy is there also where only the order has kept it.
+bool pictureIsThere(const BasketLine& line, LineForm form, const SessionState& state, const Files& files,
+                    const OrderFolder& folder) {
+    const DrivePath picture = PictureOf(line, form, state);
+    return files.fileExists(picture) ||
+           (picture != line.path && files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf()));
+}
+
+bool canGoOn(const Files& files, const UnfinishedOrder& order) {
+    const OrderState& state = order.state;
+    if (state.phase == Phase::Preparing)
+        return !state.items.isEmpty();
+    if (state.phase == Phase::Reported || (state.way != Way::Ftp && state.way != Way::Http) ||
+        (state.phase == Phase::Arrived && state.report != OrderState::Report::NotYet))
+        return false;
+    const QStringList names = files.names(order.folder.path(), u"*"_s);
+    return OrderCompleteness::read(files, order.folder, names).verdict() != OrderCompleteness::Verdict::None;
+}
+
+bool isNewer(const UnfinishedOrder& order, const UnfinishedOrder& other) {
+    const auto place = [](const UnfinishedOrder& of) {
+        const std::optional<FinishedOrder> named = FinishedOrderOf(of.folder.name());
+        return named ? std::pair(named->date, Val(named->number)) : std::pair(QDate(), 0.0);
+    };
+    return place(order) > place(other);
+}
+
+void takeUpPreparation(const UnfinishedOrder& order, SessionState& state) {
+    state.handOver = {};
+    state.handOver.lines = order.state.items;
+    state.handOver.pressStart = printsAsTheyAre(order.state.kind);
+    state.handOver.takenUp = order.folder.path();
+    state.transfer.Mefurak = Travel::Whole;
+}
+
+void takeUpSending(const UnfinishedOrder& order, SessionState& state, const Files& files) {
+    const bool inPieces = TravelsInPieces(order.folder.name());
+    state.handOver = {};
+    state.MisparHazmana = order.state.number;
+    state.Optint = order.state.kind;
+    state.shemot.ser = order.state.serial;
+    state.transfer.OrderFolder = order.folder.path();
+    state.transfer.OrderLogBase = order.folder.logBase();
+    state.transfer.ShemTikiya = order.folder.name();
+    state.transfer.HazmanaP = inPieces ? 1 : 0;
+    state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
+    state.transfer.SugMishloah = Sending::NewOrder;
+    if (order.state.choices.isEmpty())
+        ReadResentDetails(files, order.folder.logPath(), state.shemot);
+}
+
+} // namespace
+
+void tidyOrders(const SessionState& state, const Files& files) {
+    const DrivePath orders = WorkspacePaths::orders(state);
+    const QStringList names = files.folders(orders);
+    for (const QString& name : names) {
+        if (!FinishedOrderOf(name))
+            continue;
+        const OrderFolder folder(orders / name);
+        if (const DrivePath fromServer = folder.filePath(u".log-there"_s); files.fileExists(fromServer))
+            static_cast<void>(files.removeFile(fromServer));
+        removeIfEmpty(files, folder.path());
+        const Result<OrderState> order = ReadOrderState(files, folder);
+        if (!order || order->phase == Phase::Preparing || order->replaces == name || !names.contains(order->replaces))
+            continue;
+        // Of the replaced order nothing was sent; one that a later sending has taken up is none any more.
+        const DrivePath replaced = orders / order->replaces;
+        const Result<OrderState> before = ReadOrderState(files, OrderFolder(replaced));
+        if (before && before->phase <= Phase::Prepared)
+            static_cast<void>(files.removeTree(replaced));
+    }
+}
+
+DrivePath KeptWorkFolder(const OrderFolder& folder, const DrivePath& scratch) {
+    return folder.filePath(u".kept"_s) / scratch.leaf();
+}
+
+DrivePath PictureOf(const BasketLine& line, LineForm form, const SessionState& state) {
+    if (form == LineForm::Short)
+        return line.path;
+    EditFields edit;
+    UnpackEditState(line.editState, edit);
+    return edit.RedMarker == EditRecord::corrected ? WorkspacePaths::corrected(state, line.path) : line.path;
+}
+
+UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files, const OrderFolder& folder,
+                                  const OrderState& order) {
+    UnfinishedOrder counted{folder, order};
+    if (order.phase != Phase::Preparing)
+        return counted;
+    const LineForm form = lineFormOf(order.kind);
+    for (int i = 0; i < order.items.size(); ++i) {
+        const BasketLine line = BasketLine::split(order.items[i], form);
+        if (!line.hasUsableName())
+            continue;
+        ++counted.pictures;
+        if (files.fileExists(folder.filePath(PrintNameOf(line, i, order.kind))))
+            ++counted.prepared;
+        // A name outside the code page is found by nobody: it fails in any case.
+        else if (!HasQuestionMark(order.items[i]) && !pictureIsThere(line, form, state, files, folder))
+            ++counted.gone;
+    }
+    return counted;
+}
+
+QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& files) {
+    const DrivePath orders = WorkspacePaths::orders(state);
+    QList<UnfinishedOrder> unfinished;
+    QStringList replaced;
+    for (const QString& name : files.folders(orders)) {
+        const OrderFolder folder(orders / name);
+        const Result<OrderState> order = ReadOrderState(files, folder);
+        if (!order)
+            continue;
+        replaced += order->replaces;
+        if (UnfinishedOrder counted = UnfinishedOrderOf(state, files, folder, *order); canGoOn(files, counted))
+            unfinished += std::move(counted);
+    }
+    unfinished.removeIf([&](const UnfinishedOrder& order) { return replaced.contains(order.folder.name()); });
+    std::stable_sort(unfinished.begin(), unfinished.end(), isNewer);
+    return unfinished;
+}
+
+Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files) {
+    TakeChoices(order.state.choices, state);
+    if (order.state.phase == Phase::Preparing) {
+        takeUpPreparation(order, state);
+        return printsAsTheyAre(order.state.kind) ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;
+    }
+    takeUpSending(order, state, files);
+    return order.state.way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp;
+}
+
+Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder) {
+    return files.removeTree(folder.path());
+}
+
+} // namespace lumora

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "common/Result.h"
+#include "order/BasketLine.h"
+#include "order/OrderFolder.h"
+#include "order/OrderState.h"
+#include "session/PageFlow.h"
+
+#include <QList>
+
+namespace lumora {
+
+class Files;
+struct SessionState;
+
+// Takes away what a kill has left among the orders: orders that were prepared again under another number, folders that
+// were claimed and hold nothing, and the copies of logs that came from a server. Only for a data folder in which no
+// other program runs, since another's claimed folder is empty too.
+void tidyOrders(const SessionState& state, const Files& files);
+
+// An order whose preparation or sending did not come to its end.
+struct UnfinishedOrder {
+    OrderFolder folder;
+    OrderState state;
+    int pictures = 0; // lines of the basket with a usable name
+    int prepared = 0; // of these, the ones whose print is there
+    int gone = 0;     // of the others, the ones whose picture is no longer there
+};
+
+// The order as its folder and its state tell it; pictures are counted while it is being prepared.
+UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files, const OrderFolder& folder,
+                                  const OrderState& order);
+
+// The orders that can go on, newest first by the day in the name and then by the number: those that are being prepared,
+// and those for a server that have not arrived there or of which the lab has not been told. Not among them: an order
+// that another one replaces, and one without any print to send. Only for a data folder in which no other program runs.
+QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& files);
+
+// Sets the session for going on with the order, and tells the way to the page that does it.
+Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files);
+
+// Removes the order's folder with all that it holds.
+Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder);
+
+// Where the order keeps what a clean-up would take out of a scratch folder.
+DrivePath KeptWorkFolder(const OrderFolder& folder, const DrivePath& scratch);
+
+// The picture from which the print of a basket line is made: for a line whose red eyes were corrected the corrected
+// copy.
+DrivePath PictureOf(const BasketLine& line, LineForm form, const SessionState& state);
+
+} // namespace lumora

@@ -1,0 +1,160 @@
+#include "order/UnfinishedOrders.h"
+
+#include "order/OrderChoices.h"
+#include "order/OrderJournal.h"
+#include "session/Workspace.h"
+#include "support/ExampleOrder.h"
+#include "support/TestPlatform.h"
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+using Phase = OrderState::Phase;
+using Report = OrderState::Report;
+using Way = OrderState::Way;
+
+class OrdersOfAKiosk : public ::testing::Test {
+protected:
+    OrdersOfAKiosk() {
+        session = exampleOrder();
+        session.DiskRoot = test.drives.programRoot();
+        session.Optint = OrderKind::Print;
+        std::filesystem::create_directories(*test.drives.toHost(orders));
+    }
+
+    OrderFolder give(const QString& leaf, const QStringList& files = {}) {
+        const OrderFolder folder(orders / leaf);
+        EXPECT_TRUE(test.files.makeFolder(folder.path()));
+        for (const QString& file : files)
+            EXPECT_TRUE(test.files.writeWhole(folder.filePath(file), "x"));
+        return folder;
+    }
+    OrderFolder give(const QString& leaf, const OrderState& state, const QStringList& files = {}) {
+        const OrderFolder folder = give(leaf, files);
+        EXPECT_TRUE(WriteOrderState(test.files, folder, state));
+        return folder;
+    }
+    OrderState inPhase(Phase phase, const QString& number = u"105"_s) const {
+        OrderState state;
+        state.phase = phase;
+        state.number = number;
+        state.serial = u"1234"_s;
+        state.kind = OrderKind::Print;
+        state.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\two.jpg"_s, u"1 1015GNBC:\\a.b"_s,
+                       u"1 1015GNBC:\\pics\\gone.jpg"_s};
+        state.choices = ChoicesOf(session);
+        return state;
+    }
+    QStringList offered() const {
+        QStringList names;
+        for (const UnfinishedOrder& order : UnfinishedOrders(session, test.files))
+            names += order.folder.name();
+        return names;
+    }
+
+    TestPlatform test;
+    SessionState session;
+    const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
+    const QString name = u"2026_11_21_KUP_1234^105"_s;
+    const QString print = u"1 1015GNB0000_016F6E65.jpp"_s; // of the first line
+};
+
+TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
+    give(u"2026_11_21_KUP_1234^101"_s); // claimed, and then killed
+    give(u"not an order"_s);
+    give(u"2026_11_21_KUP_1234^102"_s, {".log-there", "1 1015GNB0000_0161.jpp"});
+    OrderState again = inPhase(Phase::Prepared, u"104"_s);
+    again.replaces = u"2026_11_21_KUP_1234^103"_s;
+    give(again.replaces, inPhase(Phase::Prepared, u"103"_s), {print});
+    give(u"2026_11_21_KUP_1234^104"_s, again, {print});
+    // Not whole yet: the replaced order keeps its prints.
+    OrderState underWay = inPhase(Phase::Preparing, u"106"_s);
+    underWay.replaces = name;
+    give(name, inPhase(Phase::Prepared), {print});
+    give(u"2026_11_21_KUP_1234^106"_s, underWay);
+    tidyOrders(session, test.files);
+    EXPECT_EQ(test.files.folders(orders), QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name,
+                                                       "2026_11_21_KUP_1234^106", "not an order"}));
+    EXPECT_FALSE(test.files.fileExists(orders / u"2026_11_21_KUP_1234^102" / u".log-there"));
+    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104"}))
+        << "the replaced one waits";
+}
+
+TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
+    const struct {
+        Phase phase;
+        Way way;
+        Report report;
+        bool withPrint;
+        bool offered;
+    } cases[] = {
+        {Phase::Preparing, Way::Ftp, Report::NotYet, false, true},
+        {Phase::Preparing, Way::Station, Report::NotYet, true, true},
+        {Phase::Prepared, Way::Ftp, Report::NotYet, true, true},
+        {Phase::Prepared, Way::Http, Report::NotYet, true, true},
+        {Phase::Prepared, Way::Station, Report::NotYet, true, false},
+        {Phase::Prepared, Way::Ftp, Report::NotYet, false, false}, // its print files were cleaned away
+        {Phase::Sending, Way::Mail, Report::NotYet, true, false},
+        {Phase::Sending, Way::Ftp, Report::NotYet, true, true},
+        {Phase::Arrived, Way::Http, Report::NotYet, true, true},
+        {Phase::Arrived, Way::Ftp, Report::Begun, true, false},
+        {Phase::Reported, Way::Ftp, Report::Done, true, false},
+    };
+    for (const auto& c : cases) {
+        OrderState state = inPhase(c.phase);
+        state.way = c.way;
+        state.report = c.report;
+        const OrderFolder folder = give(name, state, c.withPrint ? QStringList(print) : QStringList());
+        EXPECT_EQ(offered(), c.offered ? QStringList(name) : QStringList()) << (&c - cases);
+        ASSERT_TRUE(throwAwayOrder(test.files, folder));
+    }
+    give(name, {print, u".order"_s}); // damaged
+    give(u"2026_11_20_KUP_1234^9"_s, inPhase(Phase::Preparing, u"9"_s));
+    give(u"2026_11_21_KUP_1234^99"_s, inPhase(Phase::Preparing, u"99"_s));
+    give(u"2026_11_21_KUP_1234^100"_s, inPhase(Phase::Preparing, u"100"_s));
+    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^100", "2026_11_21_KUP_1234^99", "2026_11_20_KUP_1234^9"}));
+}
+
+TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
+    std::filesystem::create_directories(*test.drives.toHost(u"C:\\pics"_path));
+    ASSERT_TRUE(test.files.writeWhole(u"C:\\pics\\two.jpg"_path, "x"));
+    give(name, inPhase(Phase::Preparing), {print});
+    const QList<UnfinishedOrder> found = UnfinishedOrders(session, test.files);
+    ASSERT_EQ(found.size(), 1);
+    EXPECT_EQ(found[0].pictures, 3) << "a name that is too short has no print";
+    EXPECT_EQ(found[0].prepared, 1) << "its own picture may be gone";
+    EXPECT_EQ(found[0].gone, 1);
+
+    SessionState next;
+    next.DiskRoot = session.DiskRoot;
+    EXPECT_EQ(takeUpOrder(found[0], next, test.files), Outcome::PlainTakenUp);
+    EXPECT_EQ(next.handOver.lines, found[0].state.items);
+    EXPECT_EQ(next.handOver.takenUp, orders / name);
+    EXPECT_TRUE(next.handOver.pressStart);
+    EXPECT_EQ(ChoicesOf(next), ChoicesOf(session));
+
+    UnfinishedOrder order = found[0];
+    order.state.kind = OrderKind::EditedPrint;
+    EXPECT_EQ(takeUpOrder(order, next, test.files), Outcome::EditedTakenUp);
+    for (const Way way : {Way::Ftp, Way::Http}) {
+        OrderState state = inPhase(Phase::Sending);
+        state.way = way;
+        const OrderFolder folder = give(name + u'P', state);
+        SessionState sending;
+        sending.transfer.SugMishloah = Sending::Resend;
+        EXPECT_EQ(takeUpOrder({folder, *ReadOrderState(test.files, folder)}, sending, test.files),
+                  way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp);
+        EXPECT_EQ(sending.transfer.OrderFolder, folder.path());
+        EXPECT_EQ(sending.transfer.ShemTikiya, name + u'P');
+        EXPECT_EQ(sending.transfer.Mefurak, Travel::Pieces);
+        EXPECT_EQ(sending.transfer.SugMishloah, Sending::NewOrder);
+        EXPECT_EQ(sending.MisparHazmana, u"105");
+        EXPECT_EQ(sending.shemot.n1, u"Dana Levi") << "what the report says is known until it is sent";
+        EXPECT_TRUE(sending.handOver.lines.isEmpty());
+    }
+}
+
+} // namespace
+} // namespace lumora
