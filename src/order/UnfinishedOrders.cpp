@@ -8,6 +8,7 @@
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderNames.h"
+#include "order/OrderSender.h"
 #include "order/PrintFileName.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
@@ -41,11 +42,16 @@ bool pictureIsThere(const BasketLine& line, LineForm form, const SessionState& s
            (picture != line.path && files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf()));
 }
 
-bool canGoOn(const Files& files, const UnfinishedOrder& order) {
+bool canBeSent(const SessionState& session, const OrderState& state) {
+    return (state.way == Way::Ftp && SenderSetUp(session.profile, Sender::Ftp)) ||
+           (state.way == Way::Http && SenderSetUp(session.profile, Sender::Http));
+}
+
+bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOrder& order) {
     const OrderState& state = order.state;
     if (state.phase == Phase::Preparing)
         return !state.items.isEmpty();
-    if (state.phase == Phase::Reported || (state.way != Way::Ftp && state.way != Way::Http) ||
+    if (state.phase == Phase::Reported || !canBeSent(session, state) ||
         (state.phase == Phase::Arrived && state.report != OrderState::Report::NotYet))
         return false;
     const QStringList names = files.names(order.folder.path(), u"*"_s);
@@ -149,7 +155,7 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
         if (!order)
             continue;
         replaced += order->replaces;
-        if (UnfinishedOrder counted = UnfinishedOrderOf(state, files, folder, *order); canGoOn(files, counted))
+        if (UnfinishedOrder counted = UnfinishedOrderOf(state, files, folder, *order); canGoOn(state, files, counted))
             unfinished += std::move(counted);
     }
     unfinished.removeIf([&](const UnfinishedOrder& order) { return replaced.contains(order.folder.name()); });

@@ -33,7 +33,8 @@ UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files,
 
 // The orders that can go on, newest first by the day in the name and then by the number: those that are being prepared,
 // and those for a server that have not arrived there or of which the lab has not been told. Not among them: an order
-// that another one replaces, and one without any print to send. Only for a data folder in which no other program runs.
+// that another one replaces, one without any print to send, and one whose server the lab has not set up. Only for a
+// data folder in which no other program runs.
 QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& files);
 
 // Sets the session for going on with the order, and tells the way to the page that does it.

@@ -26,6 +26,7 @@ void hatchala::load() {
     m_state.SugTzad = m_deployment.SugTzad;
     m_state.DiskRoot = m_platform.files.drives().programRoot();
     loadProfile();
+    offerUnfinished();
     setTexts();
     Label6.text = QString::number(m_secondsLeft);
     Notice.text = m_state.handOver.notice;
@@ -46,7 +47,7 @@ void hatchala::setEnglish(bool english) {
 // --- leaving the page ---
 
 void hatchala::startWith(const QString& code) {
-    if (m_leaving)
+    if (m_leaving || Pic4Hemshech.visible)
         return;
     // No tick may run after the order has begun.
     m_timers.Timer4.stop();
@@ -79,8 +80,7 @@ void hatchala::startWithShop() {
 }
 
 void hatchala::handOver() {
-    for (Ticker* timer : {&m_timers.Timer1, &m_timers.Timer2, &m_timers.Timer3, &m_timers.Timer4, &m_timers.Timer5})
-        timer->stop();
+    stopTimers();
     m_leaving = true;
     m_state.KodMishloachMakor = m_state.KodMishloach;
     m_state.shemot.Mail.clear();
@@ -88,8 +88,13 @@ void hatchala::handOver() {
     m_chain.follow(PageId::hatchala, Outcome::OrderBegun);
 }
 
+void hatchala::stopTimers() {
+    for (Ticker* timer : {&m_timers.Timer1, &m_timers.Timer2, &m_timers.Timer3, &m_timers.Timer4, &m_timers.Timer5})
+        timer->stop();
+}
+
 void hatchala::askForTheShop() {
-    if (m_leaving || m_state.DeliveryChoiceMode != 1)
+    if (m_leaving || Pic4Hemshech.visible || m_state.DeliveryChoiceMode != 1)
         return;
     m_motion.foldPanel();
     Picture1.visible = true;

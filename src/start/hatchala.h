@@ -1,6 +1,7 @@
 #pragma once
 
 #include "common/DrivePath.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/Platform.h"
 #include "session/Caption.h"
 #include "session/Page.h"
@@ -43,6 +44,12 @@ struct hatchalaControls : Controls {
     Caption Image2{*this, u"Image2"};                          // the same
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
     ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
+    Caption Pic4Hemshech{*this, u"Pic4Hemshech", Caption::At::Hidden}; // the panel that offers an unfinished order
+    Caption Label4Hemshech{*this, u"Label4Hemshech"};                  // its number, and how far it came
+    Caption Label4Od{*this, u"Label4Od", Caption::At::Hidden};         // how many more there are
+    Caption Command4Hemshech{*this, u"Command4Hemshech"};              // goes on with it
+    Caption Command4Achar{*this, u"Command4Achar"};                    // puts it off
+    Caption Command4Bitul{*this, u"Command4Bitul"};                    // throws it away
     DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
     // Never shown: two buttons that code presses, and the service panel with the settings as one line of text.
@@ -71,7 +78,7 @@ struct hatchalaTimers {
 
 // hatchala, "the start page" in the glossary: the customer begins an order, opens the price list or the lab's site,
 // changes the language, and says at which shop the prints are fetched if the lab asks for it. Each load begins in
-// Hebrew with the profile of the deployment.
+// Hebrew with the profile of the deployment, and offers an order that was not finished.
 class hatchala : public Page, private hatchalaControls {
     Q_OBJECT
 public:
@@ -94,6 +101,9 @@ public:
     void List1_Click(int row) { chooseShop(row); } // also when the row is chosen already
     void Command2_Click() { startWithShop(); }
     void Picture1_Escape() { putOffTheQuestion(); }
+    void Command4Hemshech_Click() { goOnWithOrder(); }
+    void Command4Achar_Click() { putOffOrder(); }
+    void Command4Bitul_Click() { throwOrderAway(); }
     // The control under the mouse or the finger, or with the keyboard focus; Nothing for a control without help.
     enum class Hover { Nothing, Image1, Image11, Image5, Image3, Image6 };
     void MouseMove(Hover over) { showHelp(over); }
@@ -148,6 +158,15 @@ private:
     void openPriceList();
     void openSite();
     void leaveProgram();
+    void stopTimers();
+
+    // hatchalaOffer.cpp
+    void offerUnfinished();
+    void showOffer();
+    void goOnWithOrder();
+    void putOffOrder();
+    void throwOrderAway();
+
     void setEnglish(bool english);
     void showHelp(Hover over);
     void movePicture();
@@ -169,7 +188,9 @@ private:
     hatchalaTimers m_timers;
     StartMotion m_motion;
     Hover m_over = Hover::Nothing;
-    int m_secondsLeft = 5; // of the countdown
+    QList<UnfinishedOrder> m_unfinished; // the first one is offered
+    bool m_asksForGone = false;          // the panel asks whether to go on without the pictures that are gone
+    int m_secondsLeft = 5;               // of the countdown
     bool m_leaving = false;
 };
 

@@ -33,6 +33,8 @@ void hatchala::setTexts() {
                     {shopsBack, u"חזרה", u"Back"},
                     {Label7, u"מיד מתחילים", u"Starting right away"},
                     {Label8, u"V  V  V"},
+                    {Pic4Hemshech, u"הזמנה לא הושלמה", u"An order was not finished"},
+                    {Command4Bitul, u"זרוק", u"Throw away"},
                     {Command1, u"משלוח", u"Sending"},
                     {Command2, u"התחל", u"Start"},
                     {Command3, u"Read"},
@@ -43,6 +45,7 @@ void hatchala::setTexts() {
     Image8.text = QUrl(m_state.profile.SiteUrl).host();
     Label3.visible = Label4.visible = m_state.english();
     setHelp();
+    showOffer();
 
     const int chosen = List1.currentIndex();
     List1.clear();
@@ -55,6 +58,44 @@ void hatchala::setTexts() {
     List1.setCurrentIndex(chosen);
     showProfile();
     Q_EMIT changed();
+}
+
+void hatchala::showOffer() {
+    Pic4Hemshech.visible = !m_unfinished.isEmpty();
+    Q_EMIT changed();
+    if (m_unfinished.isEmpty())
+        return;
+    const UnfinishedOrder& order = m_unfinished.first();
+    // Without any picture there is no order to go on with.
+    Command4Hemshech.enabled = !m_asksForGone || order.gone < order.pictures;
+    setCaptions(m_state, {
+                             {Command4Hemshech, m_asksForGone ? u"המשך בלעדיהן" : u"המשך",
+                              m_asksForGone ? u"Go on without them" : u"Go on"},
+                             {Command4Achar, m_asksForGone ? u"המתן" : u"אחר כך", m_asksForGone ? u"Wait" : u"Later"},
+                         });
+    if (m_asksForGone)
+        Label4Hemshech.text =
+            m_state.wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
+                .arg(order.gone)
+                .arg(order.pictures);
+    else if (order.state.phase == OrderState::Phase::Preparing)
+        Label4Hemshech.text = m_state
+                                  .wording(u"הזמנה מספר %1: הוכנו %2 מתוך %3 תמונות.",
+                                           u"Order number %1: %2 of %3 pictures are prepared.")
+                                  .arg(order.state.number)
+                                  .arg(order.prepared)
+                                  .arg(order.pictures);
+    else if (order.state.phase == OrderState::Phase::Prepared)
+        Label4Hemshech.text =
+            m_state.wording(u"הזמנה מספר %1 מוכנה ועדיין לא נשלחה.", u"Order number %1 is ready and was not sent.")
+                .arg(order.state.number);
+    else
+        Label4Hemshech.text =
+            m_state.wording(u"השליחה של הזמנה מספר %1 לא הושלמה.", u"The sending of order number %1 was not finished.")
+                .arg(order.state.number);
+    Label4Od.visible = !m_asksForGone && m_unfinished.size() > 1;
+    Label4Od.text = m_state.wording(u"ועוד הזמנות שלא הושלמו: %1", u"More orders that were not finished: %1")
+                        .arg(m_unfinished.size() - 1);
 }
 
 void hatchala::setHelp() {

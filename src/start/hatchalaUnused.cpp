@@ -29,6 +29,8 @@ void hatchala::StartAutomatically() {
 }
 
 void hatchala::countDown() {
+    if (Pic4Hemshech.visible)
+        return;
     if (m_secondsLeft >= 1) {
         Label6.text = QString::number(--m_secondsLeft);
         Label6.visible = Label7.visible = true;

@@ -207,8 +207,10 @@ class Case:
             return ['not reported' if not orders and not done else f'{len(orders)} reports, {len(done)} done calls']
         if not orders or not self.careful:
             return []
-        text = orders[0].replace(self.local_order().name, 'ORDER')
-        return ['another report than that of a new order'] if text != self.tools.reports.setdefault(self.way, text) else []
+        names = [path.name for path in self.data.glob('2000lumora/!!000/*') if path.is_dir()]
+        texts = [re.sub('|'.join(map(re.escape, names)), 'ORDER', text) for text in orders]
+        usual = self.tools.reports.setdefault(self.way, texts[-1])
+        return ['another report than that of a new order'] if any(text != usual for text in texts) else []
 
     def run(self):
         self.begun = time.time()
@@ -245,10 +247,10 @@ class Case:
 
 
 class Kill(Case):
-    """The program is killed once, started again, made to go on, and takes one more order."""
+    """The program is killed once, started again, goes on with what it offers, and takes one more order."""
 
     def __init__(self, tools, number, point, at, careful):
-        moment = f'rename {abs(at)} of the preparation' if 'rename' in point else f'file {at}'
+        moment = f'rename {abs(at)}' if 'rename' in point else f'file {at}'
         super().__init__(tools, number, 'ftp', 'scripted', Fault(f'killed {point.split()[0]} {moment}'), careful)
         self.part = 'kill'
         self.environment = {'MATRIX_KILL': str(at)} if 'rename' in point else {}
@@ -270,7 +272,7 @@ class Kill(Case):
 
     def run(self):
         super().run()
-        self.good = self.text == 'arrived whole'
+        self.good = self.text in ('arrived whole', 'nothing was begun')
         return self if self.result else None
 
     def play_case(self):
@@ -278,14 +280,17 @@ class Kill(Case):
         if self.play('plain', 'ftp', **self.environment):
             return    # there are not so many renames
         first = self.local_order()
-        self.result = 'nothing kept'
-        if first:
+        arrived = False
+        # While the customer still chooses there is no order, and its folder may have been made just before.
+        self.result = 'nothing was begun'
+        begun = first and any(path.name == '.order' or path.name[0] != '.' for path in first.iterdir())
+        if begun:
             self.first_proof = self.local_files().get('000.jpg')
-            self.result = self.verdict(self.play('again', 'ftp', healed=True))
-            self.found = self.beside(1 if self.told() == 'arrived' else 0)
-        arrived = self.told() == 'arrived'
+            self.result = self.verdict(self.play('goon', 'ftp', healed=True))
+            arrived = self.told() == 'arrived'
+            self.found = self.beside(1 if arrived else 0)
         next_one = self.verdict(self.play('plain', 'ftp', healed=True))
-        if self.local_order() == first:
+        if begun and self.local_order() == first:
             self.found.append('its number and folder taken by the next order')
         elif next_one != 'arrived whole':
             self.found.append('the next order: ' + next_one)

@@ -21,6 +21,8 @@ protected:
         session = exampleOrder();
         session.DiskRoot = test.drives.programRoot();
         session.Optint = OrderKind::Print;
+        session.profile.HttpHost = session.profile.FtpServer = session.profile.FtpUser = session.profile.FtpPassword =
+            u"set up"_s;
         std::filesystem::create_directories(*test.drives.toHost(orders));
     }
 
@@ -110,6 +112,10 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         EXPECT_EQ(offered(), c.offered ? QStringList(name) : QStringList()) << (&c - cases);
         ASSERT_TRUE(throwAwayOrder(test.files, folder));
     }
+    session.profile.FtpUser.clear();
+    const OrderFolder noServer = give(name, inPhase(Phase::Sending), {print});
+    EXPECT_TRUE(offered().isEmpty()) << "there is no server to go on with";
+    ASSERT_TRUE(throwAwayOrder(test.files, noServer));
     give(name, {print, u".order"_s}); // damaged
     give(u"2026_11_20_KUP_1234^9"_s, inPhase(Phase::Preparing, u"9"_s));
     give(u"2026_11_21_KUP_1234^99"_s, inPhase(Phase::Preparing, u"99"_s));

@@ -107,6 +107,70 @@ TEST_F(hatchalaTest, TheCountdownStartsByItself) {
     EXPECT_EQ(state.KodMishloach, u"PIC");
 }
 
+TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
+    chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+    chain.registerPage(PageId::FtpFrm, [] { return std::make_unique<Page>(PageId::FtpFrm); });
+    const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
+    const auto give = [&](const QString& number, OrderState order) {
+        const OrderFolder folder(orders / (u"2026_11_21_KUP_1234^"_s + number));
+        std::filesystem::create_directories(*machine.drives.toHost(folder.path()));
+        order.number = number;
+        order.kind = OrderKind::Print;
+        EXPECT_TRUE(WriteOrderState(machine.files, folder, order));
+        EXPECT_TRUE(machine.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), "x"));
+        return folder;
+    };
+    OrderState preparing;
+    preparing.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\gone.jpg"_s};
+    OrderState sending;
+    sending.phase = OrderState::Phase::Sending;
+    const OrderFolder newer = give(u"106"_s, preparing);
+    const OrderFolder older = give(u"105"_s, sending);
+
+    hatchala* page = &start();
+    const auto& c = page->controls();
+    EXPECT_TRUE(c.Pic4Hemshech.visible && c.Label4Od.visible);
+    page->Check1_Click(true);
+    EXPECT_EQ(c.Label4Hemshech.text, u"Order number 106: 1 of 2 pictures are prepared.");
+    EXPECT_EQ(c.Label4Od.text, u"More orders that were not finished: 1");
+    page->Image1_MouseDown();
+    page->Image1_Click();
+    for (int second = 0; second < 7; ++second)
+        page->Timer4_Tick();
+    ASSERT_EQ(chain.front(), page) << "nothing begins behind the panel";
+
+    page->Command4Hemshech_Click();
+    EXPECT_EQ(c.Label4Hemshech.text, u"1 of 2 pictures are no longer where they were.");
+    EXPECT_EQ(c.Command4Hemshech.text, u"Go on without them");
+    page->Command4Achar_Click(); // the card is being looked for
+    EXPECT_EQ(c.Command4Hemshech.text, u"Go on");
+    page->Command4Hemshech_Click();
+    page->Command4Hemshech_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::Form2);
+    EXPECT_EQ(state.handOver.takenUp, newer.path());
+    chain.unload(PageId::Form2);
+
+    page = &start();
+    machine.dialogs.answers = {false, true};
+    page->Command4Bitul_Click();
+    EXPECT_TRUE(machine.files.folderExists(newer.path()));
+    page->Command4Bitul_Click();
+    EXPECT_FALSE(machine.files.folderExists(newer.path()));
+    EXPECT_FALSE(page->controls().Label4Od.visible);
+    page->Command4Hemshech_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
+    EXPECT_EQ(state.transfer.OrderFolder, older.path());
+    chain.unload(PageId::FtpFrm);
+
+    page = &start();
+    page->Command4Achar_Click();
+    EXPECT_FALSE(page->controls().Pic4Hemshech.visible);
+    page->Image1_MouseDown();
+    ASSERT_EQ(chain.front()->id(), PageId::nnn);
+    chain.unload(PageId::nnn);
+    EXPECT_FALSE(start().controls().Pic4Hemshech.visible) << "later is for the whole run";
+}
+
 TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
     deployment.DeliveryChoiceMode = 1;
     deployment.profile.LabPhone = u"09-9"_s;

@@ -1,10 +1,12 @@
 #include "PageLook.h"
 
 #include "imaging/files/PictureFile.h"
+#include "order/OrderState.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/Workspace.h"
 #include "start/hatchala.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
@@ -72,6 +74,30 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
     walk.press(u"hatchala"_s, u"shopsBack"_s);
     EXPECT_FALSE(page.controls().Picture1.visible);
     look(walk, u"01-start"_s);
+}
+
+TEST_P(StartLook, TheOfferOfAnOrderThatWasNotFinished) {
+    Walk walk(GetParam());
+    SessionState& state = walk.program().state();
+    for (const QString& number : {u"105"_s, u"106"_s}) {
+        const OrderFolder folder(WorkspacePaths::orders(state) / (u"2026_11_21_KUP_1234^"_s + number));
+        std::filesystem::create_directories(*walk.program().platform().files.drives().toHost(folder.path()));
+        OrderState order;
+        order.number = number;
+        order.kind = OrderKind::Print;
+        order.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\two.jpg"_s};
+        ASSERT_TRUE(WriteOrderState(walk.program().platform().files, folder, order));
+    }
+    PageChain& chain = walk.program().chain();
+    chain.unload(PageId::hatchala);
+    walk.settle();
+    startPage(walk).Check1_Click(GetParam().english);
+    look(walk, u"01-start-unfinished"_s);
+    walk.press(u"hatchala"_s, u"Command4Hemshech"_s);
+    look(walk, u"01-start-unfinished-gone"_s);
+    walk.press(u"hatchala"_s, u"Command4Achar"_s);
+    walk.press(u"hatchala"_s, u"Command4Achar"_s);
+    EXPECT_FALSE(startPage(walk).controls().Pic4Hemshech.visible);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, StartLook, PageLook::screens(), PageLook::nameOf);

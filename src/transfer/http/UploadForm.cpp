@@ -1,5 +1,6 @@
 #include "transfer/http/UploadForm.h"
 
+#include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
@@ -94,7 +95,15 @@ void UploadForm::findMissing() {
     Pic4Timer.visible = Image4.visible = Picture5.visible = false;
     Picture1.visible = true;
     stopTimers();
+    OrderJournal journal = orderJournal();
+    static_cast<void>(journal.arrived(true));
+    static_cast<void>(journal.needsNoReport());
     enter(SendingPhase::AllThere);
+}
+
+// What can't be written of it only leads to one more offer to go on: the server's list decides then too.
+OrderJournal UploadForm::orderJournal() const {
+    return {m_platform.files, OrderFolder::chosen(m_state)};
 }
 
 void UploadForm::growPanel() {
@@ -156,6 +165,7 @@ void UploadForm::sendMissing() {
     Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
     Command15.enabled = true;
     forgetReason();
+    static_cast<void>(orderJournal().sendingBegins(Sender::Http, false));
     const std::optional<SendingPhase> end = m_sender.HttpAttempts();
     if (!end)
         return;
@@ -180,11 +190,18 @@ void UploadForm::succeed() {
     m_attemptFailed = false;
     forgetReason();
     enter(SendingPhase::Reporting);
+    OrderJournal journal = orderJournal();
+    static_cast<void>(journal.arrived(true));
     m_sender.HttpPause(2);
-    if (m_state.transfer.SugMishloah == Sending::NewOrder && !m_sender.stop.left) {
+    if (m_state.transfer.SugMishloah != Sending::NewOrder) {
+        static_cast<void>(journal.needsNoReport());
+    } else if (!m_sender.stop.left) {
+        static_cast<void>(journal.reportBegun());
         m_sender.HttpSendReport();
         m_sender.HttpPause(2);
         m_sender.HttpSendDone();
+        if (!m_sender.stop.left)
+            static_cast<void>(journal.reportDone());
     }
     if (m_sender.stop.left)
         return;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/OrderJournal.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/SendingPage.h"
 #include "transfer/http/HttpSender.h"
@@ -105,6 +106,7 @@ private:
     void sendAgain();
     void sendMissing();
     void succeed();
+    OrderJournal orderJournal() const;
     void leaveForAnother();
 
     // UploadFormTexts.cpp

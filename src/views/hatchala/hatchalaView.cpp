@@ -26,6 +26,7 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     frame().content()->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.size(Space::Tight));
     frame().content()->addWidget(m_arrow);
     makeShops();
+    makeOffer();
 
     for (const char* name : {"Image1", "Image11", "Image5", "Image3"})
         findChild<QWidget*>(QString::fromLatin1(name))->setProperty("sinks", true);
@@ -156,6 +157,17 @@ void hatchalaView::makeShops() {
     bind(u"Picture1"_s, m_shops->card(), [this] { return c.Picture1.text; });
 }
 
+// The offer to go on with an order that was not finished.
+void hatchalaView::makeOffer() {
+    m_offer = new Overlay(
+        theme(), this, {label(c.Pic4Hemshech, "title"), label(c.Label4Hemshech, "large"), label(c.Label4Od, "muted")});
+    QPushButton* goOn = button(c.Command4Hemshech, Role::Main, &hatchala::Command4Hemshech_Click);
+    m_offer->addRow({button(c.Command4Bitul, Role::Quiet, &hatchala::Command4Bitul_Click, u"trash"_s), Item::room(),
+                     button(c.Command4Achar, Role::Secondary, &hatchala::Command4Achar_Click), goOn});
+    m_offer->setFirstFocus(goOn);
+    m_offer->whenEscaped(toPage(&hatchala::Command4Achar_Click));
+}
+
 void hatchalaView::helpFor(QWidget* widget, hatchala::Hover over) {
     m_hovers.emplace_back(widget, over);
     widget->installEventFilter(this);
@@ -242,6 +254,7 @@ void hatchalaView::render() {
     speak(m_shopList, spoken);
     renderMotion();
     m_shops->setOpen(c.Picture1.visible);
+    m_offer->setOpen(c.Pic4Hemshech.visible);
 }
 
 } // namespace lumora

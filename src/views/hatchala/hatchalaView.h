@@ -32,6 +32,7 @@ private:
     QWidget* makeContact();
     void makeStart();
     void makeShops();
+    void makeOffer();
     void helpFor(QWidget* widget, hatchala::Hover over);
     void renderMotion();
     void renderAdvert();
@@ -61,6 +62,7 @@ private:
     };
     std::vector<Help> m_helps;
     Overlay* m_shops = nullptr;
+    Overlay* m_offer = nullptr;
     QWidget* m_shopList = nullptr;
     std::vector<std::pair<QWidget*, hatchala::Hover>> m_hovers;
 };

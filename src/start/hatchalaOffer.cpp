@@ -1,0 +1,71 @@
+// The panel of the start page that offers an order which was not finished.
+#include "platform/Dialogs.h"
+#include "platform/Instances.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "start/hatchala.h"
+
+#include <utility>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+// An order that seems unfinished may be under way in another program.
+void hatchala::offerUnfinished() {
+    if (m_platform.instances.another())
+        return;
+    tidyOrders(m_state, m_platform.files);
+    if (!m_state.offerPutOff)
+        m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+}
+
+void hatchala::goOnWithOrder() {
+    if (m_leaving || !Pic4Hemshech.visible)
+        return;
+    // Pictures may have gone or come back, with their card, since the panel opened.
+    UnfinishedOrder& order = m_unfinished.first();
+    order = UnfinishedOrderOf(m_state, m_platform.files, order.folder, order.state);
+    if (order.gone > 0 && (!m_asksForGone || order.gone == order.pictures)) {
+        m_asksForGone = true;
+        showOffer();
+        return;
+    }
+    const SessionState before = m_state;
+    if (m_chain.follow(PageId::hatchala, takeUpOrder(order, m_state, m_platform.files))) {
+        m_leaving = true;
+        stopTimers();
+    } else {
+        m_state = before;
+    }
+}
+
+void hatchala::putOffOrder() {
+    if (m_leaving || !Pic4Hemshech.visible)
+        return;
+    // Waiting for the pictures leads back to the offer.
+    if (!std::exchange(m_asksForGone, false)) {
+        m_state.offerPutOff = true;
+        m_unfinished.clear();
+    }
+    showOffer();
+}
+
+void hatchala::throwOrderAway() {
+    if (m_leaving || !Pic4Hemshech.visible)
+        return;
+    const UnfinishedOrder order = m_unfinished.first();
+    if (!m_platform.dialogs.ask(m_state
+                                    .wording(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
+                                             u"Throw order number %1 away? It can't be brought back.")
+                                    .arg(order.state.number)) ||
+        m_leaving)
+        return;
+    if (const Result<void> gone = throwAwayOrder(m_platform.files, order.folder); !gone)
+        m_platform.dialogs.message(gone.failure().message);
+    m_asksForGone = false;
+    m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+    showOffer();
+}
+
+} // namespace lumora
