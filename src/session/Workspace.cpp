@@ -150,10 +150,12 @@ Result<void> Workspace::CleanWorkspace(QString& MisparHazmana) const {
     return written;
 }
 
-void Workspace::CleanHistory() const {
+void Workspace::CleanHistory(const std::function<bool(const DrivePath&)>& keeps) const {
     const DrivePath orders = WorkspacePaths::orders(m_state);
     for (const QString& order : m_files.folders(orders)) {
         const DrivePath folder = orders / order;
+        if (keeps && keeps(folder))
+            continue;
         const QStringList names = m_files.names(folder, u"*.*"_s);
         // The first file of a folder is its order sheet, which stays as the record of the order.
         for (qsizetype i = 1; i < names.size(); ++i) {

@@ -6,6 +6,8 @@
 
 #include <QString>
 
+#include <functional>
+
 namespace lumora {
 
 struct SessionState;
@@ -45,8 +47,9 @@ public:
     // not or cannot be deleted are passed over.
     Result<void> CleanWorkspace(QString& MisparHazmana) const;
 
-    // Removes the print files of the orders already made, but for the file at index 0 of each folder.
-    void CleanHistory() const;
+    // Removes the print files of the orders already made, but for the file at index 0 of each folder and for the orders
+    // whose folder keeps() tells.
+    void CleanHistory(const std::function<bool(const DrivePath&)>& keeps = {}) const;
 
     // Writes the next order's number into the counter file. A larger number in the file stays, since an order that was
     // taken up later must not give the numbers after it a second time.

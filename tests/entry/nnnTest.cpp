@@ -1,6 +1,10 @@
 #include "DetailsPageTest.h"
 
+#include "order/OrderFolder.h"
+#include "order/OrderState.h"
+
 #include <functional>
+#include <optional>
 
 namespace lumora {
 namespace {
@@ -245,25 +249,81 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     EXPECT_TRUE(chain.hasEnded());
 }
 
-TEST_F(nnnTest, CleansTheHistoryOnceItIsAsked) {
+TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndKeepsWhatMayNotHaveArrived) {
+    using Phase = OrderState::Phase;
+    using Way = OrderState::Way;
+    const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
+    const struct {
+        QString number;
+        std::optional<Phase> phase; // none: made by an earlier version
+        Way way;
+    } given[] = {{"101", {}, Way::Ftp},
+                 {"102", Phase::Reported, Way::Ftp},
+                 {"103", Phase::Sending, Way::Http},
+                 {"104", Phase::Prepared, Way::Station},
+                 {"105", Phase::Sending, Way::Mail},
+                 {"106", Phase::Arrived, Way::Ftp}};
+    const auto folderOf = [&](const QString& number) { return orders / (u"2026_11_20_KUP_1234^"_s + number); };
+    const auto makeOrders = [&] {
+        for (const auto& g : given) {
+            const OrderFolder folder(folderOf(g.number));
+            std::filesystem::remove_all(host(folder.path()));
+            makeFolder(folder.path());
+            for (const QString& name : {u"!1.jpp"_s, u"a.jpp"_s, folder.name() + u".txt"_s})
+                ASSERT_TRUE(machine.files.writeWhole(folder.filePath(name), "x"));
+            OrderState order;
+            order.phase = g.phase.value_or(Phase::Prepared);
+            order.way = g.way;
+            if (g.phase) {
+                ASSERT_TRUE(WriteOrderState(machine.files, folder, order));
+            }
+        }
+    };
+    const auto left = [&] {
+        QStringList numbers;
+        for (const auto& g : given) {
+            if (machine.files.fileExists(folderOf(g.number) / u"a.jpp"))
+                numbers += g.number;
+        }
+        return numbers;
+    };
     nnn& page = start();
     const nnnControls& shown = page.controls();
-    page.Image1_Click(0);
-    page.Command2_Click();
-    const DrivePath order = u"C:\\2000lumora\\!!000\\order"_path;
-    makeFolder(order.parent());
-    makeFolder(order);
-    for (const char* name : {"!1.jpp", "a.jpp", "order.txt"})
-        ASSERT_TRUE(machine.files.writeWhole(order / QString::fromLatin1(name), "x").ok());
-    page.Command14_Click();
-    EXPECT_TRUE(shown.Frame1.visible && shown.Command7.visible);
-    page.Command7_Click();
-    EXPECT_FALSE(shown.Frame1.visible);
-    EXPECT_EQ(machine.dialogs.messages, QStringList({"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד"}));
-    EXPECT_EQ(machine.files.names(order, u"*"_s), QStringList({"!1.jpp", "order.txt"}));
+    const struct {
+        bool careful;
+        QList<bool> answers; // are the earlier ones marked as arrived; are those not proven cleaned too
+        QStringList left;
+    } cases[] = {{false, {false}, {}},
+                 {true, {false, false}, {"101", "103", "104", "105"}},
+                 {true, {true, false}, {"103", "104", "105"}},
+                 {true, {false, true}, {}}};
+    for (const auto& c : cases) {
+        makeOrders();
+        state.Careful = c.careful;
+        machine.dialogs.answers = c.answers;
+        machine.dialogs.messages.clear();
+        page.Command14_Click();
+        EXPECT_TRUE(shown.Frame1.visible && shown.Command7.visible);
+        EXPECT_TRUE(shown.Frame1.text.endsWith(u"הזמנות שלא הוכח שהגיעו: 2; של התחנה: 1; שיצאו בדואר: 1."))
+            << shown.Frame1.text.toStdString();
+        page.Command7_Click();
+        EXPECT_FALSE(shown.Frame1.visible);
+        EXPECT_EQ(machine.dialogs.messages,
+                  QStringList({"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד"}));
+        EXPECT_EQ(left(), c.left) << (&c - cases);
+        EXPECT_TRUE(machine.dialogs.answers.isEmpty());
+        EXPECT_TRUE(machine.files.fileExists(folderOf(u"101"_s) / u"!1.jpp"));
+    }
     chain.unload(PageId::nnn);
     deployment.MinuyPaar = 2;
     EXPECT_FALSE(start().controls().Command14.visible) << "a lab without quick orders";
+}
+
+TEST_F(nnnTest, OpensTheFinishedOrdersAlsoWhereTheDiskIsFull) {
+    makeFolder(u"C:\\2000lumora\\!!000\\mana.txt"_s); // can't be written
+    start().Image1_Click(4);
+    EXPECT_EQ(machine.dialogs.messages.size(), 1);
+    EXPECT_EQ(chain.front()->id(), PageId::MoogMeret);
 }
 
 TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {

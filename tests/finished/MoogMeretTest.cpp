@@ -4,6 +4,9 @@
 #include "finished/mail/MailResult.h"
 #include "imaging/files/PictureFile.h"
 #include "order/FinishedOrder.h"
+#include "order/OrderFolder.h"
+#include "order/OrderLog.h"
+#include "order/OrderState.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/TestPlatform.h"
@@ -136,6 +139,7 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
 TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     const QString empty = u"2026_11_19_KUP_1234^103"_s;
     ASSERT_TRUE(test.files.makeFolder(DrivePath(orders + u'\\' + empty)).ok());
+    test.dialogs.answers = {true}; // it has no details, and is looked at all the same
     MoogMeret& page = startWith(empty);
     EXPECT_EQ(page.controls().Label1.text, u"0");
     EXPECT_TRUE(page.controls().Label4Reka.visible);
@@ -198,6 +202,65 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
     EXPECT_EQ(chain.front()->id(), PageId::UploadForm);
     EXPECT_TRUE(state.handOver.lines.isEmpty()) << "that sender takes the folder whole";
     EXPECT_EQ(state.transfer.OrderFolder.text(), orders + u'\\' + pieces);
+    chain.unload(PageId::UploadForm);
+
+    state.Careful = true;
+    startWith(whole).Command4_Click();
+    EXPECT_EQ(chain.front()->id(), PageId::FtpFrm) << "its sheet is a print file: it was made for FTP";
+}
+
+TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked) {
+    chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+    const QString name = u"2026_11_22_KUP_1234^106"_s;
+    const OrderFolder folder{DrivePath(orders) / name};
+    const auto give = [&](bool withState, const QStringList& basket) {
+        std::filesystem::create_directories(*test.drives.toHost(folder.path()));
+        write(name, u"1 1015GNB0000_016F6E65.jpp"_s);
+        OrderState order;
+        order.number = u"106"_s;
+        order.kind = OrderKind::Print;
+        order.items = basket;
+        if (withState) {
+            EXPECT_TRUE(WriteOrderState(test.files, folder, order));
+        }
+    };
+    const QStringList complete = {u"1 1015GNBC:\\one.jpg"_s};
+    const QStringList lacking = complete + QStringList{u"1 1015GNBC:\\gone.jpg"_s};
+    const struct {
+        bool withState;
+        QStringList basket;
+        QList<bool> answers;
+        bool picked, there, goesOn;
+    } cases[] = {
+        {true, complete, {true}, false, true, true},
+        {true, lacking, {true, true}, false, true, true},
+        {true, lacking, {true, false}, false, true, false}, // it waits for the pictures
+        {true, complete, {false, false}, false, true, false},
+        {true, complete, {false, true}, false, false, false},
+        {false, {}, {true}, true, true, false},
+        {false, {}, {false, false}, false, true, false},
+        {false, {}, {false, true}, false, false, false},
+    };
+    for (const auto& c : cases) {
+        give(c.withState, c.basket);
+        MoogMeret& page = start();
+        EXPECT_EQ(page.orderRow(name).mark, u"לא הושלמה");
+        EXPECT_TRUE(page.orderRow(pieces).mark.isEmpty());
+        test.dialogs.answers = c.answers;
+        page.List3_Click(page.controls().List3.find(name));
+        EXPECT_TRUE(test.dialogs.answers.isEmpty()) << (&c - cases);
+        EXPECT_EQ(chain.front()->id(), c.goesOn ? PageId::Form2 : PageId::MoogMeret) << (&c - cases);
+        EXPECT_EQ(test.files.folderExists(folder.path()), c.there) << (&c - cases);
+        if (!c.goesOn) {
+            EXPECT_EQ(page.phase(), c.picked ? MoogMeret::Phase::Picked : MoogMeret::Phase::Orders);
+            EXPECT_EQ(page.controls().List3.count(), c.there ? 3 : 2);
+        } else {
+            EXPECT_EQ(state.handOver.takenUp, folder.path());
+        }
+        chain.unload(chain.front()->id());
+        chain.unload(PageId::MoogMeret);
+        std::filesystem::remove_all(*test.drives.toHost(folder.path()));
+    }
 }
 
 TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
@@ -303,6 +366,55 @@ TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedTh
     page.Command2_Click();
     EXPECT_EQ(leaves(page.controls().List1.items()), u"!104_1234.jpp 11b.JPG");
     EXPECT_EQ(page.controls().List1.currentIndex(), 0);
+}
+
+// Of four packages two have gone when the customer stops.
+TEST_F(FinishedOrders, AStoppedWalkGoesOnWithWhatIsUnsentWhereTheLabIsCareful) {
+    state.profile.mail.host = u"192.0.2.25"_s;
+    const QString order = u"2026_11_22_KUP_1234^106"_s;
+    const OrderFolder folder{DrivePath(orders) / order};
+    ASSERT_TRUE(test.files.makeFolder(folder.path()));
+    const QStringList prints = {u"1 1015GNB0000_016F6E65.jpp"_s, u"1 1015GNB0001_016F6E65.jpp"_s,
+                                u"1 1015GNB0002_016F6E65.jpp"_s};
+    for (const QString& leaf : prints + QStringList{u"!106_1234.jpp"_s})
+        write(order, leaf);
+    state.MisparHazmana = u"106"_s;
+    const QStringList basket(3, u"1 1015GNBC:\\pics\\one.jpg"_s);
+    ASSERT_TRUE(test.files.writeWhole(
+        folder.logPath(), OrderLog::of(state, OrderLog::Layout::Plain, basket, {}, test.clock.time).write()));
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        test.mail.messages.clear();
+        MoogMeret& page = startWith(order);
+        test.clock.time = at("10:00:00");
+        page.Command2_Click();
+        for (const char* time : {"10:03:00", "10:03:00"})
+            tick(time);
+        page.Command19_Click();
+        ASSERT_EQ(test.mail.messages.size(), 2);
+        test.dialogs.answers = {true};
+        page.Command2_Click();
+        EXPECT_EQ(page.controls().List1.currentIndex(), careful ? 2 : 0);
+        for (int minute = 20; page.phase() == MoogMeret::Phase::Walking; minute += 3)
+            tick(u"10:%1:00"_s.arg(minute).toLatin1().constData());
+        EXPECT_EQ(test.mail.messages.size(), careful ? 4 : 6);
+        EXPECT_TRUE(page.walk().allSent());
+        EXPECT_EQ(ReadOrderState(test.files, folder)->way, OrderState::Way::Mail);
+        chain.unload(PageId::MoogMeret);
+    }
+    // Careful: fewer prints than the log names go only if the customer wants it, and none not at all.
+    test.dialogs.answers.clear();
+    test.dialogs.questions.clear();
+    MoogMeret& page = startWith(order);
+    page.File1_Click(page.controls().File1.find(prints[0]));
+    page.Command2_Click();
+    EXPECT_TRUE(test.dialogs.questions.value(0).contains(u"3")) << "the log's number";
+    EXPECT_EQ(page.phase(), MoogMeret::Phase::Picked);
+    page.Command21_Click();
+    page.File1_Click(page.controls().File1.find(u"!106_1234.jpp"_s));
+    page.Command2_Click();
+    EXPECT_EQ(test.dialogs.messages.last(), u"אין בהזמנה זו אף תמונה להדפסה, ולכן לא נשלח דבר.");
+    EXPECT_EQ(test.mail.messages.size(), 4);
 }
 
 TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {

@@ -5,6 +5,8 @@
 #include "entry/details/TileMenu.h"
 #include "entry/details/VolumeMark.h"
 #include "entry/notice/Havharot.h"
+#include "order/HistoryState.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -70,8 +72,7 @@ void nnn::takeTile(int tile) {
             beginPrints(tile);
         break;
     case MailTile:
-        if (ready)
-            goToFinishedOrders();
+        goToFinishedOrders();
         break;
     case AlbumTile:
         if (ready)
@@ -131,7 +132,8 @@ void nnn::beginAlbum() {
 void nnn::goToFinishedOrders() {
     clearChoices();
     m_state.Optint = orderKindOf(MailTile);
-    if (prepareOrder() && m_chain.follow(pageId, Outcome::FinishedWanted))
+    prepareOrder(); // the orders of a full disk are there all the same
+    if (m_chain.follow(pageId, Outcome::FinishedWanted))
         m_leaving = true;
 }
 
@@ -397,11 +399,22 @@ void nnn::cancel() {
 
 void nnn::askToClean(bool asked) {
     Frame1.visible = asked;
+    if (asked)
+        showHistory(HistoryState::of(m_state, m_platform.files));
     showStep();
 }
 
 void nnn::cleanHistory() {
-    Workspace(m_state, m_platform.files).CleanHistory();
+    const HistoryState before = HistoryState::of(m_state, m_platform.files);
+    if (!before.legacy.isEmpty() && asksToMarkLegacy(before))
+        succeeded(before.markLegacyArrived(m_platform.files));
+    const HistoryState history = HistoryState::of(m_state, m_platform.files);
+    const bool keeps = m_state.Careful && history.count() > 0 && !asksToCleanNotProven(history);
+    if (m_leaving)
+        return;
+    Workspace(m_state, m_platform.files).CleanHistory([&](const DrivePath& folder) {
+        return keeps && history.contains(folder);
+    });
     tell(u"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד",
          u"The history has been cleaned\nThis concerns files of this program only");
     askToClean(false);

@@ -10,6 +10,7 @@
 namespace lumora {
 
 class PageChain;
+struct HistoryState;
 struct SessionState;
 
 // nnn, "details of the order" in the glossary: the customer takes the kind of order from a menu and then, step by step,
@@ -125,6 +126,9 @@ private:
     void cancel();
     void askToClean(bool asked);
     void cleanHistory();
+    void showHistory(const HistoryState& history);
+    bool asksToMarkLegacy(const HistoryState& history);
+    bool asksToCleanNotProven(const HistoryState& history);
     void showNotice();
 
     void focusOn(const QString& control);

@@ -1,6 +1,9 @@
 #include "entry/details/TileMenu.h"
 #include "entry/details/nnn.h"
 
+#include "order/HistoryState.h"
+#include "order/OrderFolder.h"
+#include "platform/Dialogs.h"
 #include "session/CaptionTexts.h"
 
 // What the page says.
@@ -45,60 +48,88 @@ void nnn::setTexts() {
     m_quickSizes = m_state.profile.QuickSizes;
     for (std::size_t i = 0; i < Option3.size(); ++i)
         Option3[i].text = paperKind(static_cast<int>(i));
-    setCaptions(m_state,
-                {
-                    {LabelText2, u"שם פרטי ומשפחה", u"First and last name"},
-                    {LabelText3, u"טלפון", u"Telephone"},
-                    {LabelText4, u"כתובת למשלוח", u"Delivery address"},
-                    {Check2, u"זכור פרטים לפעם הבאה", u"Remember my details for next time"},
-                    {Command10, u"פרטים מהזיכרון", u"Details from memory"},
-                    {Command12, u"המשך", u"Next"},
-                    {Command8, u"המשך", u"Next"},
-                    {Command6, u"המשך", u"Next"},
-                    {Command3, u"המשך לבחירת התמונות", u"On to the pictures"},
-                    {Command24, u"המשך לדף הבא", u"On to the next page"},
-                    {Command4, u"חזור לאחור", u"Go back"},
-                    {Command2, u"בטל", u"Cancel"},
+    setCaptions(m_state, {
+                             {LabelText2, u"שם פרטי ומשפחה", u"First and last name"},
+                             {LabelText3, u"טלפון", u"Telephone"},
+                             {LabelText4, u"כתובת למשלוח", u"Delivery address"},
+                             {Check2, u"זכור פרטים לפעם הבאה", u"Remember my details for next time"},
+                             {Command10, u"פרטים מהזיכרון", u"Details from memory"},
+                             {Command12, u"המשך", u"Next"},
+                             {Command8, u"המשך", u"Next"},
+                             {Command6, u"המשך", u"Next"},
+                             {Command3, u"המשך לבחירת התמונות", u"On to the pictures"},
+                             {Command24, u"המשך לדף הבא", u"On to the next page"},
+                             {Command4, u"חזור לאחור", u"Go back"},
+                             {Command2, u"בטל", u"Cancel"},
 
-                    {LabelSizes, u"גודל התמונות", u"Paper size"},
-                    {LabelCombo1, u"גדלים נוספים", u"More sizes"},
-                    {LabelKinds, u"סוג הנייר", u"Paper kind"},
+                             {LabelSizes, u"גודל התמונות", u"Paper size"},
+                             {LabelCombo1, u"גדלים נוספים", u"More sizes"},
+                             {LabelKinds, u"סוג הנייר", u"Paper kind"},
 
-                    {Image13[0], u"ללא מסגרת", u"No border"},
-                    {Image13[1], u"מסגרת B7", u"Border B7"},
-                    {Image13[2], u"מסגרת BB1", u"Border BB1"},
-                    {Image13[3], u"מסגרת BB2", u"Border BB2"},
-                    {Image13[4], u"מסגרת CA1", u"Border CA1"},
-                    {Image13[5], u"מסגרת BB", u"Border BB"},
-                    {Image13[6], u"מסגרת CA9", u"Border CA9"},
-                    {Image13[7], u"מסגרת BL1", u"Border BL1"},
-                    {Image13[8], u"מסגרת FA9", u"Border FA9"},
-                    {Image13[9], u"מסגרת לבנה", u"White border"},
+                             {Image13[0], u"ללא מסגרת", u"No border"},
+                             {Image13[1], u"מסגרת B7", u"Border B7"},
+                             {Image13[2], u"מסגרת BB1", u"Border BB1"},
+                             {Image13[3], u"מסגרת BB2", u"Border BB2"},
+                             {Image13[4], u"מסגרת CA1", u"Border CA1"},
+                             {Image13[5], u"מסגרת BB", u"Border BB"},
+                             {Image13[6], u"מסגרת CA9", u"Border CA9"},
+                             {Image13[7], u"מסגרת BL1", u"Border BL1"},
+                             {Image13[8], u"מסגרת FA9", u"Border FA9"},
+                             {Image13[9], u"מסגרת לבנה", u"White border"},
 
-                    {Label2, u"FIT", u"FIT"},
-                    {Label3, u"FIL", u"FIL"},
-                    {Option4, u"כל התמונה על הנייר, עם שוליים", u"The whole picture, with margins"},
-                    {Option5, u"מילוי כל הנייר, עם חיתוך", u"Fill the paper, edges are cut"},
+                             {Label2, u"FIT", u"FIT"},
+                             {Label3, u"FIL", u"FIL"},
+                             {Option4, u"כל התמונה על הנייר, עם שוליים", u"The whole picture, with margins"},
+                             {Option5, u"מילוי כל הנייר, עם חיתוך", u"Fill the paper, edges are cut"},
 
-                    {LabelChoice, u"מה שבחרת", u"What you chose"},
-                    {LabelCheck1, u"לפני שממשיכים", u"Before going on"},
-                    {Check1, u"מסכים תנאי שימוש", u"I agree to the terms of use"},
-                    {Command29, u"קרא תנאי שימוש", u"Read the terms of use"},
-                    {Command30, u"סגור", u"Close"},
-                    {LabelTerms, u"יש לסמן את תיבת ההסכמה לפני המעבר לבחירת התמונות",
-                     u"Tick the box before you go on to the pictures"},
-                    {Label8, u"V  V  V", u"V  V  V"},
+                             {LabelChoice, u"מה שבחרת", u"What you chose"},
+                             {LabelCheck1, u"לפני שממשיכים", u"Before going on"},
+                             {Check1, u"מסכים תנאי שימוש", u"I agree to the terms of use"},
+                             {Command29, u"קרא תנאי שימוש", u"Read the terms of use"},
+                             {Command30, u"סגור", u"Close"},
+                             {LabelTerms, u"יש לסמן את תיבת ההסכמה לפני המעבר לבחירת התמונות",
+                              u"Tick the box before you go on to the pictures"},
+                             {Label8, u"V  V  V", u"V  V  V"},
 
-                    {Command14, u"ניקיון היסטוריה", u"Clean the history"},
-                    {Command15, u"הבהרות ואזהרות", u"Clarifications and warnings"},
-                    {Frame1, u"למחוק את קבצי ההדפסה של ההזמנות הקודמות?", u"Delete the print files of earlier orders?"},
-                    {Command7, u"נקה", u"Clean"},
-                    {Command9, u"השאר", u"Keep them"},
-                });
+                             {Command14, u"ניקיון היסטוריה", u"Clean the history"},
+                             {Command15, u"הבהרות ואזהרות", u"Clarifications and warnings"},
+                             {Command7, u"נקה", u"Clean"},
+                             {Command9, u"השאר", u"Keep them"},
+                         });
     if (!Combo1.taken() && m_state.shemot.ppr != Combo1.text)
         Combo1.text = sizesPrompt();
     m_album.setTexts();
+    showHistory(Frame1.visible ? HistoryState::of(m_state, m_platform.files) : HistoryState());
     showStep();
+}
+
+void nnn::showHistory(const HistoryState& history) {
+    Frame1.text =
+        m_state.wording(u"למחוק את קבצי ההדפסה של ההזמנות הקודמות?", u"Delete the print files of earlier orders?");
+    if (history.count() > 0)
+        Frame1.text += u'\n' + m_state
+                                   .wording(u"הזמנות שלא הוכח שהגיעו: %1; של התחנה: %2; שיצאו בדואר: %3.",
+                                            u"Orders not proven to have arrived: %1; of the local station: %2; sent by "
+                                            "mail: %3.")
+                                   .arg(history.notProven.size())
+                                   .arg(history.station.size())
+                                   .arg(history.mail.size());
+}
+
+bool nnn::asksToMarkLegacy(const HistoryState& history) {
+    return m_platform.dialogs.ask(
+        m_state
+            .wording(u"%1 הזמנות הוכנו בגרסה קודמת. לסמן את כולן כהזמנות שהגיעו?",
+                     u"%1 orders were made by an earlier version. Mark all of them as arrived?")
+            .arg(history.legacy.size()));
+}
+
+bool nnn::asksToCleanNotProven(const HistoryState& history) {
+    return m_platform.dialogs.ask(
+        m_state
+            .wording(u"למחוק גם את קבצי ההדפסה של %1 ההזמנות שלא הוכח שהגיעו?",
+                     u"Delete also the print files of the %1 orders not proven to have arrived?")
+            .arg(history.count()));
 }
 
 QString nnn::sizesPrompt() const {

@@ -33,7 +33,7 @@ void PackageWalk::take(const QDateTime& now) {
 PackageWalk::Step PackageWalk::step(int inHand, const QDateTime& now) {
     if (m_minutes <= minutesOfPackage)
         return Step::Wait;
-    if (inHand > count() - 2)
+    if (nextUnsent(inHand) < 0)
         return Step::Over;
     take(now);
     return Step::Next;
@@ -54,6 +54,12 @@ double PackageWalk::share(int inHand) const {
 
 PackageWalk::Fate PackageWalk::fate(int package) const {
     return package >= 0 && package < count() ? m_fates[static_cast<std::size_t>(package)] : Fate::Waiting;
+}
+
+int PackageWalk::nextUnsent(int after) const {
+    const auto from = m_fates.begin() + std::min(after + 1, count());
+    const auto next = std::find_if(from, m_fates.end(), [](Fate fate) { return fate != Fate::Sent; });
+    return next == m_fates.end() ? -1 : static_cast<int>(next - m_fates.begin());
 }
 
 int PackageWalk::count(Fate fate) const {

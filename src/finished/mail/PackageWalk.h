@@ -18,7 +18,8 @@ public:
     // Starts the minutes of a package.
     void take(const QDateTime& now);
 
-    // Whether to wait, to begin the next package, or to end after the last one. The minutes stop at the end.
+    // Whether to wait, to begin the next package that was not sent, or to end after the last one. The minutes stop at
+    // the end.
     enum class Step { Wait, Next, Over };
     Step step(int inHand, const QDateTime& now);
     // Takes the minutes since the start of the package.
@@ -30,7 +31,8 @@ public:
 
     enum class Fate { Waiting, Sending, Sent, Failed };
     void tell(int package, Fate fate) { m_fates[static_cast<std::size_t>(package)] = fate; }
-    Fate fate(int package) const; // Waiting for a package that does not exist
+    Fate fate(int package) const;    // Waiting for a package that does not exist
+    int nextUnsent(int after) const; // -1 when there is none; after is -1 for the first
     int count() const { return static_cast<int>(m_fates.size()); }
     int count(Fate fate) const;
     bool allSent() const { return count() > 0 && count(Fate::Sent) == count(); }

@@ -3,9 +3,11 @@
 #include "common/FixedText.h"
 #include "finished/orders/UnreadableFolders.h"
 #include "imaging/files/PictureFile.h"
+#include "order/HistoryState.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
+#include "order/OrderSender.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"
 #include "platform/Platform.h"
@@ -128,9 +130,12 @@ void MoogMeret::refreshOrders() {
     openFolder(orders);
     List2.clear();
     List3.clear();
+    m_notFinished.clear();
     for (const QString& name : Dir1.items()) {
         List2.append((orders / name).text());
         List3.append(name);
+        if (CompletionOf(m_platform.files, OrderFolder(orders / name)) != Completion::Finished)
+            m_notFinished += name;
     }
     Picture1 = {};
     Label4Rek.visible = List3.isEmpty();
@@ -153,7 +158,7 @@ void MoogMeret::listFiles(const DrivePath& folder) {
 }
 
 void MoogMeret::pickOrder(int index) {
-    if (!mayAct() || index < 0 || index >= List3.count())
+    if (!mayAct() || index < 0 || index >= List3.count() || !mayBePicked(OrderFolder(DrivePath(List2.item(index)))))
         return;
     List3.setCurrentIndex(index);
     List2.setCurrentIndex(index);
@@ -265,7 +270,10 @@ void MoogMeret::sendAgain() {
     enter(Phase::Leaving);
     m_state.transfer.SugMishloah = Sending::Resend;
     m_state.transfer.OrderFolder = m_files.folder();
-    const bool byHttp = m_state.transfer.SugSheliach == Sender::Http;
+    const Sender by = m_state.Careful
+                          ? SenderForResend(m_state.profile, OrderFolder(m_files.folder()), m_platform.files)
+                          : m_state.transfer.SugSheliach;
+    const bool byHttp = by == Sender::Http;
     if (!byHttp)
         m_state.handOver.lines = List1.items();
     m_chain.follow(PageId::MoogMeret, byHttp ? Outcome::ResentByHttp : Outcome::ResentByFtp);

@@ -10,6 +10,7 @@
 
 namespace lumora {
 
+class OrderFolder;
 class PageChain;
 struct OrderDetails;
 struct Platform;
@@ -138,10 +139,12 @@ public:
     Phase phase() const { return m_phase; }
     const MoogMeretControls& controls() const override { return *this; }
     const FilesToSend& files() const { return m_files; }
-    // An order as the list shows it; hint says that it is in pieces, otherwise it is empty.
+    // An order as the list shows it; hint says that it is in pieces, mark that it was not finished. Otherwise they are
+    // empty.
     struct OrderRow {
         QString text;
         QString hint;
+        QString mark;
     };
     OrderRow orderRow(const QString& folderName) const;
     const PackageWalk& walk() const { return m_walk; }
@@ -163,6 +166,13 @@ private:
     void openFolder(const DrivePath& folder);
     void listFiles(const DrivePath& folder);
     void pickOrder(int index);
+
+    // MoogMeretUnfinished.cpp
+    bool mayBePicked(const OrderFolder& folder);
+    void offerToFinish(const OrderFolder& folder);
+    void offerToThrowAway(const OrderFolder& folder);
+    void finishOrder(const OrderFolder& folder);
+
     void showOrder(const DrivePath& folder);
     void showWhatIsMarked();
     void loadPreview();
@@ -178,7 +188,13 @@ private:
     void leaveAfterWalk();
     void leaveProgram();
 
+    // MoogMeretTexts.cpp
+    bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
+
     void sendByMail();
+    bool mayBeMailed();
+    bool asksToGoOn();
+    void walkFrom(int first);
     void listPackages();
     void beginWalk();
     void stepWalk();
@@ -198,7 +214,9 @@ private:
     const Platform& m_platform;
     PageChain& m_chain;
     FilesToSend m_files;
+    QStringList m_notFinished; // names of the listed orders whose preparation did not come to its end
     PackageWalk m_walk;
+    bool m_walksWholeOrder = false; // all prints of the order are among the packages
     Ticker Timer3;
     Phase m_phase = Phase::Orders;
 };

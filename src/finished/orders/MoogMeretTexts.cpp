@@ -3,6 +3,8 @@
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"
 #include "order/OrderNames.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
 #include "session/CaptionTexts.h"
 
 namespace lumora {
@@ -49,13 +51,22 @@ void MoogMeret::setTexts() {
 }
 
 MoogMeret::OrderRow MoogMeret::orderRow(const QString& folderName) const {
-    OrderRow row{folderName, {}};
+    OrderRow row{folderName, {}, {}};
     if (const auto order = FinishedOrderOf(folderName))
         row.text = m_state.wording(u"מס' %1   %2"_s, u"No. %1   %2"_s)
                        .arg(order->number, order->date.toString(u"dd.MM.yyyy"_s));
     if (TravelsInPieces(folderName))
         row.hint = m_state.wording(u"הזמנה בחלקים"_s, u"An order in pieces"_s);
+    if (m_notFinished.contains(folderName))
+        row.mark = m_state.wording(u"לא הושלמה"_s, u"not finished"_s);
     return row;
+}
+
+bool MoogMeret::asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers) {
+    QString question = m_state.wording(hebrew, english);
+    for (const QString& number : numbers)
+        question = question.arg(number);
+    return m_platform.dialogs.ask(question);
 }
 
 void MoogMeret::showWhatIsMarked() {

@@ -3,9 +3,13 @@
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
 #include "finished/orders/MoogMeret.h"
+#include "order/OrderCompleteness.h"
+#include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace lumora {
@@ -28,12 +32,50 @@ int MoogMeret::packagesDone() const {
 void MoogMeret::sendByMail() {
     if (!mayAct())
         return;
+    if (asksToGoOn()) {
+        walkFrom(m_walk.nextUnsent(-1));
+        return;
+    }
+    if (!mayAct())
+        return;
     listPackages();
     if (List1.isEmpty())
         tellNothingIsMarked(m_state.wording(u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s,
                                             u"You chose no files to send from the yellow window."_s));
-    else
+    else if (mayBeMailed())
         beginWalk();
+}
+
+// An order without a picture does not leave, and one with fewer than its log names only if the customer wants it.
+bool MoogMeret::mayBeMailed() {
+    QStringList marked;
+    for (const QString& path : List1.items())
+        marked += LeafName(path);
+    const OrderCompleteness counts = OrderCompleteness::read(m_platform.files, OrderFolder(m_files.folder()), marked);
+    m_walksWholeOrder = counts.verdict() == OrderCompleteness::Verdict::Whole;
+    if (!m_state.Careful)
+        return true;
+    if (counts.verdict() == OrderCompleteness::Verdict::None) {
+        tellNothingIsMarked(m_state.wording(u"אין בהזמנה זו אף תמונה להדפסה, ולכן לא נשלח דבר."_s,
+                                            u"This order holds no picture to print, so nothing is sent."_s));
+        return false;
+    }
+    return counts.verdict() != OrderCompleteness::Verdict::Fewer ||
+           (asks(u"לפי הרישום יש בהזמנה %1 תמונות, ורק %2 מהן יישלחו. לשלוח בכל זאת?",
+                 u"The order's log names %1 pictures, and only %2 of them would be sent. Send all the same?",
+                 {QString::number(counts.named.value_or(0)),
+                  QString::number(std::min(counts.present, counts.marked))}) &&
+            mayAct());
+}
+
+// Behind a stop, with the same files marked, the customer chooses whether what was sent is sent again.
+bool MoogMeret::asksToGoOn() {
+    const int unsent = m_walk.count() - m_walk.count(PackageWalk::Fate::Sent);
+    return m_state.Careful && m_phase == Phase::Walked && m_walk.count(PackageWalk::Fate::Sent) > 0 && unsent > 0 &&
+           List1.items() == m_files.mailList() &&
+           asks(u"נשארו %1 מנות שלא נשלחו. כן: להמשיך בהן. לא: להתחיל מחדש.",
+                u"%1 packages were not sent. Yes: go on with them. No: begin again.", {QString::number(unsent)}) &&
+           mayAct();
 }
 
 void MoogMeret::listPackages() {
@@ -47,8 +89,13 @@ void MoogMeret::listPackages() {
 void MoogMeret::beginWalk() {
     if (sending() || List1.isEmpty())
         return;
+    m_walk.begin(List1.count(), m_platform.clock.now());
+    walkFrom(0);
+}
+
+void MoogMeret::walkFrom(int first) {
     const QDateTime now = m_platform.clock.now();
-    m_walk.begin(List1.count(), now);
+    m_walk.take(now);
     Label4Doar.text =
         mailSetUp() ? QString()
                     : m_state.wording(u"לא הוגדר שרת דואר, ולכן המנות רק נספרות ואינן נשלחות."_s,
@@ -56,7 +103,8 @@ void MoogMeret::beginWalk() {
     Label4Sof.text.clear();
     Label4Shaa.text = now.toString(u"HH:mm:ss"_s);
     enter(Phase::Walking);
-    selectPackage(0);
+    List1.setCurrentIndex(-1); // the first one is sent also if it is the present one
+    selectPackage(first);
     // The customer may have stopped the walk or left while the package was sent.
     if (m_phase != Phase::Walking)
         return;
@@ -79,7 +127,7 @@ void MoogMeret::stepWalk() {
     if (step == PackageWalk::Step::Over)
         endWalk();
     else if (step == PackageWalk::Step::Next)
-        selectPackage(List1.currentIndex() + 1);
+        selectPackage(m_walk.nextUnsent(List1.currentIndex()));
     if (m_phase != Phase::Walking)
         return;
     m_walk.measure(m_platform.clock.now());
@@ -143,6 +191,8 @@ void MoogMeret::sendPackage(int index) {
     else
         outcome = {MailEnd::AttachmentMissing, path.text()};
     m_walk.tell(index, outcome.end == MailEnd::Sent ? PackageWalk::Fate::Sent : PackageWalk::Fate::Failed);
+    if (m_walksWholeOrder && m_walk.allSent()) // unwritten it counts as not proven, and its prints stay
+        static_cast<void>(OrderJournal(m_platform.files, OrderFolder(order)).wentByMail());
     Label4Doar.text = MailResultText(MailResultCode(outcome.end), m_state.english()).trimmed();
     Label4Doar.hint = outcome.words;
     showOutcome();

@@ -20,8 +20,10 @@ MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const T
 }
 
 QWidget* MoogMeretView::makeOrders() {
-    m_orders = list(c.List3, &MoogMeret::List3_Click,
-                    [&page = m_page](const QString& name) { return page.orderRow(name).text; });
+    m_orders = list(c.List3, &MoogMeret::List3_Click, [&page = m_page](const QString& name) {
+        const MoogMeret::OrderRow row = page.orderRow(name);
+        return row.mark.isEmpty() ? row.text : row.text + u'\n' + row.mark;
+    });
     m_orders->setProperty("names", true); // the date beside the number is seen whole
     m_orders->setTextElideMode(Qt::ElideRight);
     const Card card = makeCard("card", Pad::Normal);
@@ -139,9 +141,12 @@ void MoogMeretView::renderOrders() {
     m_orders->setAccessibleName(c.Label4Shalav1.text);
     for (int row = 0; row < m_orders->count(); ++row) {
         QListWidgetItem* item = m_orders->item(row);
-        const QString hint = m_page.orderRow(c.List3.item(row)).hint;
-        setIcon(item, hint.isEmpty() ? u"pictures"_s : u"layers"_s, Theme::Colour::Primary);
-        item->setToolTip(hint);
+        const MoogMeret::OrderRow order = m_page.orderRow(c.List3.item(row));
+        if (order.mark.isEmpty())
+            setIcon(item, order.hint.isEmpty() ? u"pictures"_s : u"layers"_s, Theme::Colour::Primary);
+        else
+            setIcon(item, u"warning"_s, Theme::Colour::Danger);
+        item->setToolTip(order.hint);
     }
 }
 

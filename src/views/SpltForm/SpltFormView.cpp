@@ -28,7 +28,8 @@ QWidget* SpltFormView::firstFocus() const {
 
 QVBoxLayout* SpltFormView::makeList(const TextList& rows, const Caption& caption, void (SpltForm::*clicked)(int)) {
     QLabel* title = label(caption, "smallMuted");
-    QListWidget* made = clicked ? list(rows, clicked, LeafName) : listing(rows, LeafName);
+    const auto shown = [](const QString& path) { return fromLeft(LeafName(path)); };
+    QListWidget* made = clicked ? list(rows, clicked, shown) : listing(rows, shown);
     made->setProperty("names", true);
     made->setLayoutDirection(Qt::LeftToRight); // names of files, whose middle may be left out
     made->setUniformItemSizes(true);
