@@ -51,8 +51,9 @@ HostPath write(const QTemporaryDir& folder, const char* name, const QByteArray& 
 // --- What every connection must keep, that of the fake lab too ---
 
 struct Lab {
+    enum class Server { Fake, Lab, Second, Given };
     const char* name;
-    bool isSecond = false;
+    Server server = Server::Lab;
     FtpType type = FtpType::Image;
     bool keepsNames = true; // in the ANSI code page
 };
@@ -64,32 +65,44 @@ void PrintTo(const Lab& lab, std::ostream* out) {
 class FtpContract : public ::testing::TestWithParam<Lab> {
 protected:
     void SetUp() override {
-        const Lab& lab = GetParam();
-        if (lab.isSecond) {
-            otherServer.emplace();
-            ASSERT_TRUE(otherServer->running()) << otherServer->failure().toStdString();
-            std::filesystem::create_directory(otherServer->account() / "zalamim234");
-        } else if (lab.name != std::string("fake")) {
+        switch (GetParam().server) {
+        case Lab::Server::Fake:
+            fake.folders[u"zalamim234"_s];
+            login = {u"fake"_s, LabServers::user(), LabServers::password()};
+            break;
+        case Lab::Server::Lab:
             labServers.emplace();
             ASSERT_TRUE(labServers->running()) << labServers->failure().toStdString();
-        } else {
-            fake.folders[u"zalamim234"_s];
+            login = {labServers->ftpHost(), LabServers::user(), LabServers::password()};
+            account = labServers->account();
+            break;
+        case Lab::Server::Second:
+            second.emplace();
+            ASSERT_TRUE(second->running()) << second->failure().toStdString();
+            login = {second->ftpHost(), SecondFtpServer::user(), SecondFtpServer::password()};
+            account = second->account();
+            std::filesystem::create_directory(account / "zalamim234");
+            break;
+        case Lab::Server::Given:
+            // Host, user, password and folder of a running server; tests/matrix/run gives each of its own.
+            login = qEnvironmentVariable("LUMORA_FTP_SERVER").split(u' ', Qt::SkipEmptyParts);
+            if (login.isEmpty())
+                GTEST_SKIP() << "no LUMORA_FTP_SERVER is given";
+            ASSERT_EQ(login.size(), 4);
+            account = toHostPath(login[3]);
+            break;
         }
     }
 
-    bool isFake() const { return !otherServer && !labServers; }
+    bool isFake() const { return GetParam().server == Lab::Server::Fake; }
     Result<std::unique_ptr<FtpConnection>> connect(DataChannel channel, const QString& password = {}) {
         Internet& line = isFake() ? static_cast<Internet&>(fake) : internet;
-        const QString host = otherServer ? otherServer->ftpHost() : labServers ? labServers->ftpHost() : QString();
-        const QString user = otherServer ? SecondFtpServer::user() : LabServers::user();
-        const QString right = otherServer ? SecondFtpServer::password() : LabServers::password();
-        return line.connectFtp(host, user, password.isEmpty() ? right : password, channel);
+        return line.connectFtp(login[0], login[1], password.isEmpty() ? login[2] : password, channel);
     }
     QByteArray stored(const QString& folder, const char* name) {
         if (isFake())
             return fake.folders[folder].contains(QLatin1String(name)) ? fake.folders[folder][QLatin1String(name)]
                                                                       : QByteArray("<absent>");
-        const HostPath account = otherServer ? otherServer->account() : labServers->account();
         return contentOf(account / toHostPath(folder) / name);
     }
 
@@ -97,7 +110,9 @@ protected:
     FakeLab fake;
     PocoInternet internet{TimeLimits(), GetParam().type};
     std::optional<LabServers> labServers;
-    std::optional<SecondFtpServer> otherServer;
+    std::optional<SecondFtpServer> second;
+    QStringList login;
+    HostPath account;
 };
 
 std::map<QString, std::optional<qint64>> filesOf(const FtpListing& listing) {
@@ -211,9 +226,10 @@ TEST_P(FtpContract, AnAbortEndsTheConnectionsThatStandAndNoOther) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Labs, FtpContract,
-                         ::testing::Values(Lab{.name = "fake"}, Lab{.name = "vsftpd_A", .type = FtpType::Ascii},
-                                           Lab{.name = "vsftpd_I"},
-                                           Lab{.name = "pyftpdlib", .isSecond = true, .keepsNames = false}),
+                         ::testing::Values(Lab{.name = "fake", .server = Lab::Server::Fake},
+                                           Lab{.name = "vsftpd_A", .type = FtpType::Ascii}, Lab{.name = "vsftpd_I"},
+                                           Lab{.name = "pyftpdlib", .server = Lab::Server::Second, .keepsNames = false},
+                                           Lab{.name = "given", .server = Lab::Server::Given}),
                          [](const ::testing::TestParamInfo<Lab>& each) { return each.param.name; });
 
 // --- A line with faults in front of the lab's server ---
