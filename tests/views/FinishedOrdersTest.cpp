@@ -22,7 +22,8 @@ QString makeOrders(Walk& walk) {
     for (int number = 98; number <= 106; ++number) {
         last = u"2026_11_%1_KUP_1234^%2"_s.arg(number - 80).arg(number) + (number == 106 ? u"P"_s : QString());
         const DrivePath folder = WorkspacePaths::orders(walk.program().state()) / last;
-        walk.write(folder / (last + u".txt"_s), "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n");
+        if (number != 104) // its preparation did not come to the end
+            walk.write(folder / (last + u".txt"_s), "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n");
         walk.write(folder / u"!106_1234.jpp", *encodeJpeg(Bitmap(640, 480, Qt::cyan), 90));
         for (int i = 0; i < 9; ++i)
             walk.write(folder / u"0%1 1015GNB000%2_0%3AABB.jpp"_s.arg(i % 3 + 1).arg(i).arg(i), "print");
