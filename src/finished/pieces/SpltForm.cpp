@@ -80,8 +80,7 @@ void SpltForm::addPieces() {
     List4Famely.clear();
     m_families = JudgeFamilies(List4Bodedim, ListChalakim);
     m_fates.assign(m_families.size(), Fate::Listed);
-    Label1.text = QString::number(ListChalakim.count());
-    Label5.text = QString::number(List4Bodedim.count());
+    m_piecesRead = true;
     showCounts();
     enter(Phase::Idle);
 }
@@ -98,8 +97,8 @@ void SpltForm::choosePiece(int index) {
     if (m_phase == Phase::Working)
         return;
     ListChalakim.setCurrentIndex(index);
-    Label8.text.clear();
-    Label9.text.clear();
+    m_length.reset();
+    m_lengthOf = {};
     showCounts();
     enter(m_phase);
 }
@@ -109,8 +108,8 @@ void SpltForm::showLengthOfChosen() {
     if (m_phase == Phase::Working || path.isEmpty())
         return;
     const auto size = m_platform.files.size(path);
-    Label8.text = size ? QString::number(*size) : QString();
-    Label9.text = path.text().left(2);
+    m_length = size ? std::optional(*size) : std::nullopt;
+    m_lengthOf = path;
     showCounts();
     if (!size)
         m_platform.dialogs.message(reason(size.failure()));

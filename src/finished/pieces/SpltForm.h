@@ -5,6 +5,8 @@
 #include "session/Caption.h"
 #include "session/Page.h"
 
+#include <optional>
+
 namespace lumora {
 
 class PageChain;
@@ -142,6 +144,9 @@ private:
     Mod4split m_pieces;
     std::vector<PieceFamily> m_families; // one for each entry of List4Bodedim
     std::vector<Fate> m_fates;
+    bool m_piecesRead = false;      // a folder of pieces was read
+    std::optional<qint64> m_length; // of m_lengthOf in bytes; no value before it is asked for, or if it can't be read
+    DrivePath m_lengthOf;           // the piece whose length was asked for
     Phase m_phase = Phase::Idle;
     DrivePath m_folder; // folder of the last picked file
     int m_index = 0;    // index of the present file or family

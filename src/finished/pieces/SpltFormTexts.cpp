@@ -45,14 +45,21 @@ void SpltForm::setTexts() {
 }
 
 void SpltForm::showCounts() {
-    if (!Label1.text.isEmpty())
-        Label4Counts.text =
-            wording(u"קבצים: %1 · משפחות: %2"_s, u"Files: %1 · families: %2"_s).arg(Label1.text, Label5.text);
+    if (m_piecesRead) {
+        const QString files = QString::number(ListChalakim.count());
+        const QString families = QString::number(List4Bodedim.count());
+        Label1.text = files;
+        Label5.text = families;
+        Label4Counts.text = wording(u"קבצים: %1 · משפחות: %2"_s, u"Files: %1 · families: %2"_s).arg(files, families);
+    }
+    const QString length = m_length ? QString::number(*m_length) : QString();
+    const QString drive = m_lengthOf.text().left(2);
+    Label8.text = length;
+    Label9.text = drive;
     // The isolating marks keep the drive's colon behind its letter in Hebrew text.
-    Label4Length.text = Label8.text.isEmpty()
-                            ? QString()
-                            : wording(u"%1 בתים, כונן \u2066%2\u2069"_s, u"%1 bytes, drive \u2066%2\u2069"_s)
-                                  .arg(Label8.text, Label9.text);
+    Label4Length.text =
+        m_length ? wording(u"%1 בתים, כונן \u2066%2\u2069"_s, u"%1 bytes, drive \u2066%2\u2069"_s).arg(length, drive)
+                 : QString();
 }
 
 SpltForm::FamilyRow SpltForm::familyRow(int index) const {

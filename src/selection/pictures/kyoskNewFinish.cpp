@@ -66,7 +66,7 @@ void kyoskNew::openClosingPanel() {
     }
     PicB4Sioom.visible = Frame4.visible = true;
     Label19.text = m_state.shemot.ppr;
-    Label20.text = Label7.text;
+    Label20.text = QString::number(m_choice.basket().SumCopies());
     if (m_state.Optint == OrderKind::Album)
         Txt4Ml2.text = m_state.album.MailZalam;
     Q_EMIT changed();
