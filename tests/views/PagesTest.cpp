@@ -3,8 +3,11 @@
 #include "assembly/edited/B3.h"
 #include "entry/details/nnn.h"
 #include "order/EditRecord.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/Workspace.h"
 #include "views/window/ScreenDialogs.h"
 
 #include <QTest>
@@ -101,9 +104,15 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     state.handOver.lines = {code + u"\\missing picture.jpg"_s};
     for (int i = 1; i <= 12; ++i)
         state.handOver.lines += code + u"\\IMG_00%1.jpg"_s.arg(i, 2, 10, QChar(u'0'));
+    // An order whose folder can't be made waits for a second press.
+    const Files& files = walk.program().platform().files;
+    const DrivePath orders = WorkspacePaths::orders(state);
+    ASSERT_TRUE(files.makeFolder(orders.folder()).ok() && files.writeWhole(orders, "no folder").ok());
     walk.program().chain().show(PageId::B3);
     auto& page = walk.page<B3>(PageId::B3);
-    page.Timer2.stop();
+    page.Command5_Click();
+    walk.program().dialogs().closeMessages();
+    ASSERT_TRUE(files.removeFile(orders).ok());
     look(walk, u"25-to-prepare"_s);
     // In the middle of the work: the timer ticks while the page lets the screen update.
     QTimer middle;

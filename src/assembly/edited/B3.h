@@ -44,8 +44,6 @@ public:
     const B3Controls& controls() const override { return *this; }
     bool isPrintShown() const { return !Picture5.visible && !Picture3.isNull(); }
 
-    Ticker Timer2;
-
 private:
     PreparationControls& shared() override { return *this; }
     void setPreparing(bool on) override;
@@ -56,6 +54,7 @@ private:
     void printed(const Bitmap& small) override;
     void sheetDrawn(const Bitmap& sheet) override;
 
+    Ticker Timer2; // 2000 ms: the start by itself
     EditedPreparation m_preparation;
     std::optional<PaperSize> m_paper; // as it was when the page was loaded
 };
