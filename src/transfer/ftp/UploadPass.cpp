@@ -55,7 +55,7 @@ bool UploadPass::endEarly() {
 }
 
 void UploadPass::watch() {
-    if (!m_running || m_end)
+    if (!m_running || m_end || m_stop.StopFlag)
         return;
     m_silence.moved(m_platform.internet.bytesMoved() + m_skipped, m_platform.clock.now());
     if (!m_silence.over())
