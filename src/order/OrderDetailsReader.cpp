@@ -38,6 +38,19 @@ std::optional<OrderLog> readLog(const Files& files, const DrivePath& path, Order
     return log;
 }
 
+// The same with the fields cleared before, and with what an album's log has of them.
+std::optional<OrderLog> readResent(const Files& files, const DrivePath& path, OrderDetails& details) {
+    setAll(details, {});
+    auto log = readLog(files, path, details);
+    if (log && log->layout == OrderLog::Layout::Album) {
+        details.n1 = log->album.ShemZalam;
+        details.ppr = log->album.GodelLBM;
+        details.Mail = log->album.MailZalam;
+        details.TotalPics = log->shemot.TotalPics;
+    }
+    return log;
+}
+
 } // namespace
 
 void ReadOrderDetails(const Files& files, const DrivePath& path, OrderDetails& details) {
@@ -45,14 +58,18 @@ void ReadOrderDetails(const Files& files, const DrivePath& path, OrderDetails& d
 }
 
 void ReadResentDetails(const Files& files, const DrivePath& path, OrderDetails& details) {
-    setAll(details, {});
-    const auto log = readLog(files, path, details);
-    if (!log || log->layout != OrderLog::Layout::Album)
+    readResent(files, path, details);
+}
+
+void ReadReportDetails(const Files& files, const DrivePath& path, OrderDetails& details) {
+    details.n3.clear();
+    const auto log = readResent(files, path, details);
+    if (!log)
         return;
-    details.n1 = log->album.ShemZalam;
-    details.ppr = log->album.GodelLBM;
-    details.Mail = log->album.MailZalam;
-    details.TotalPics = log->shemot.TotalPics;
+    if (log->layout == OrderLog::Layout::Album)
+        details.Hearot = log->album.HearotLBM;
+    else
+        details.n3 = log->shemot.n3;
 }
 
 } // namespace lumora

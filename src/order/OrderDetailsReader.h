@@ -14,4 +14,8 @@ void ReadOrderDetails(const Files& files, const DrivePath& path, OrderDetails& d
 // album's log come the photographer, the size, the mail address and the total.
 void ReadResentDetails(const Files& files, const DrivePath& path, OrderDetails& details);
 
+// What a report tells of an order that is sent again: the fields of ReadResentDetails(), the delivery address, and an
+// album's remarks.
+void ReadReportDetails(const Files& files, const DrivePath& path, OrderDetails& details);
+
 } // namespace lumora

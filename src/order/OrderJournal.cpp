@@ -118,9 +118,13 @@ Result<void> OrderJournal::arrived(bool byNameOnly) {
 
 Result<void> OrderJournal::reportBegun() {
     makeKnown();
+    const OrderState before = m_state;
     OrderState next = m_state;
     next.report = OrderState::Report::Begun;
-    return keep(next);
+    const Result<void> kept = keep(next);
+    if (!kept)
+        m_state = before;
+    return kept;
 }
 
 Result<void> OrderJournal::reportDone() {

@@ -39,7 +39,7 @@ public:
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);
     Result<void> arrived(bool byNameOnly);
-    // Before report and done call, and behind them.
+    // Before report and done call, and behind them. A begin that could not be kept has not taken place.
     Result<void> reportBegun();
     Result<void> reportDone();
     // The order has arrived and the lab wants no report.

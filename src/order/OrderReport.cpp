@@ -22,6 +22,19 @@ QString onOneLine(QString value) {
     return value;
 }
 
+QString valueIn(const QString& value, ReportForm form) {
+    if (form == ReportForm::AsItStands)
+        return value;
+    QString encoded;
+    for (const QChar letter : value) {
+        if (u"%&#+"_s.contains(letter))
+            encoded += u'%' + QString::number(letter.unicode(), 16).toUpper();
+        else
+            encoded += letter;
+    }
+    return encoded;
+}
+
 } // namespace
 
 QString PaperKindLetter(const QString& maat) {
@@ -33,22 +46,23 @@ QString PaperKindLetter(const QString& maat) {
     return {};
 }
 
-QString OrderReportQuery(const ClientProfile& profile, const TransferState& transfer, const OrderDetails& shemot) {
+QString OrderReportQuery(const ClientProfile& profile, const TransferState& transfer, const OrderDetails& shemot,
+                         ReportForm form) {
     if (!isReported(transfer))
         return {};
-    return onOneLine(u"?k1="_s + profile.ClientCode +              //
-                     u"&t1="_s + transfer.ShemTikiya + u"    "_s + //
-                     SizeCode(shemot.ppr, u"_"_s) + PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit + u'_' +
-                     shemot.Bord + u"&t2=Notes: "_s + shemot.Hearot +                                        //
-                     u"&t3=Pratim: "_s + shemot.n2 + u"    "_s + shemot.n1 + u"&t4=Adress: "_s + shemot.n3 + //
-                     u"&t5=Mail: "_s + shemot.Mail +                                                         //
-                     u"&t8=Total_pics: "_s + QString::number(shemot.TotalPics));
+    const QString order = transfer.ShemTikiya + u"    "_s + SizeCode(shemot.ppr, u"_"_s) +
+                          PaperKindLetter(shemot.maat) + u'_' + shemot.FillFit + u'_' + shemot.Bord;
+    return onOneLine(u"?k1="_s + valueIn(profile.ClientCode, form) + u"&t1="_s + valueIn(order, form) +
+                     u"&t2=Notes: "_s + valueIn(shemot.Hearot, form) + u"&t3=Pratim: "_s +
+                     valueIn(shemot.n2 + u"    "_s + shemot.n1, form) + u"&t4=Adress: "_s + valueIn(shemot.n3, form) +
+                     u"&t5=Mail: "_s + valueIn(shemot.Mail, form) + u"&t8=Total_pics: "_s +
+                     QString::number(shemot.TotalPics));
 }
 
-QString DoneQuery(const ClientProfile& profile, const TransferState& transfer) {
+QString DoneQuery(const ClientProfile& profile, const TransferState& transfer, ReportForm form) {
     if (!isReported(transfer))
         return {};
-    return onOneLine(u"?t1="_s + profile.ClientCode + u"&t2=true"_s);
+    return onOneLine(u"?t1="_s + valueIn(profile.ClientCode, form) + u"&t2=true"_s);
 }
 
 } // namespace lumora

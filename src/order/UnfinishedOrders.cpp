@@ -87,7 +87,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
     state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
     state.transfer.SugMishloah = Sending::NewOrder;
     if (order.state.choices.isEmpty())
-        ReadResentDetails(files, order.folder.logPath(), state.shemot);
+        ReadReportDetails(files, order.folder.logPath(), state.shemot);
 }
 
 } // namespace

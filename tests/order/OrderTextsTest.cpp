@@ -79,7 +79,8 @@ TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAg
     TestPlatform test;
     const DrivePath path = u"C:\\log.txt"_path;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"00\",\"00\"\r\n\"TotalPics\",14\r\n\"GodelLBM\",\"30/60\"\r\n"
-                                      "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n");
+                                      "\"MailZalam\",\"studio@example.com\"\r\n\"ShemZalam\",\"Studio Or\"\r\n"
+                                      "\"Hearot\",\"for the wall\"\r\n");
     OrderDetails details; // a new album has no customer, and the address may have been mended since
     details.Mail = u"as corrected@example.com"_s;
     details.Bord = u"NB"_s;
@@ -87,11 +88,15 @@ TEST(ReadOrderDetails, LeavesANewAlbumAsTheSessionKnowsItAndReadsOneThatIsSentAg
     EXPECT_EQ(details.n1, QString());
     EXPECT_EQ(details.Mail, u"as corrected@example.com"_s);
     EXPECT_EQ(details.TotalPics, 0);
+    details.n3 = u"of another order"_s;
     ReadResentDetails(test.files, path, details);
-    EXPECT_EQ(details.n1, u"Studio Or"_s);
-    EXPECT_EQ(details.ppr, u"30/60"_s);
-    EXPECT_EQ(details.Mail, u"studio@example.com"_s);
+    EXPECT_EQ(details.n1 + details.ppr + details.Mail, u"Studio Or30/60studio@example.com"_s);
     EXPECT_EQ(details.Bord, QString()) << "of another order";
+    EXPECT_EQ(details.TotalPics, 14);
+    EXPECT_EQ(details.Hearot, QString());
+    ReadReportDetails(test.files, path, details);
+    EXPECT_EQ(details.n1 + details.n3, u"Studio Or"_s);
+    EXPECT_EQ(details.Hearot, u"for the wall"_s);
     EXPECT_EQ(details.TotalPics, 14);
 }
 

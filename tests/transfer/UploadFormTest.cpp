@@ -107,6 +107,27 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
     }
 }
 
+TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverItIsFound) {
+    for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
+        for (const bool careful : {true, false}) {
+            FakeWebLab other;
+            UploadFormRig found(other);
+            found.state.Careful = careful;
+            found.state.transfer.SugMishloah = sending;
+            other.uploads[UploadFormRig::name()] = found.localFiles();
+            UploadForm& page = found.start();
+            EXPECT_EQ(page.phase(), careful ? SendingPhase::Success : SendingPhase::AllThere);
+            EXPECT_EQ(other.reports.size(), careful ? 2 : 0);
+            page.Command2_Click();
+            EXPECT_EQ(page.phase(), SendingPhase::AllThere);
+            EXPECT_TRUE(page.controls().Label11.visible);
+            EXPECT_FALSE(page.counting());
+            EXPECT_EQ(other.reports.size(), careful ? 2 : 0);
+            EXPECT_EQ(other.posted.size(), 0);
+        }
+    }
+}
+
 TEST_F(UploadFormTest, AReportThatNobodyTakesIsNotRepeatedAndChangesNothing) {
     lab.onPost = [&](const QString& name) {
         if (name == UploadFormRig::log()) // the last: the check's three calls pass, the report does not

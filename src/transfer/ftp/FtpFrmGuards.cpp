@@ -66,20 +66,11 @@ void FtpFrm::keepArrival(SendingPhase end) {
 
 void FtpFrm::tellLab() {
     OrderJournal* journal = m_sender.session.journal();
-    if (m_state.profile.ReportOn <= 0) {
-        if (journal)
-            m_sender.session.keep(journal->needsNoReport());
+    if (!journal || !m_chain.isRegistered(PageId::InetForm))
         return;
-    }
-    if (!m_chain.isRegistered(PageId::InetForm))
-        return;
-    if (journal)
-        m_sender.session.keep(journal->reportBegun());
-    auto& reports = m_chain.load<InetForm>();
-    reports.reportOrder();
-    reports.reportDone();
-    if (journal)
-        m_sender.session.keep(journal->reportDone());
+    ReportOnce reports(m_state, m_platform.files, *journal);
+    reports.tell(Sender::Ftp, m_chain.load<InetForm>());
+    m_sender.session.keep(reports.kept());
 }
 
 } // namespace lumora

@@ -3,7 +3,6 @@
 #include "common/AnsiCodePage.h"
 #include "common/DrivePath.h"
 #include "order/OrderFolder.h"
-#include "order/OrderReport.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -54,6 +53,15 @@ QString HttpSender::FetchUrl(const QString& url) const {
 void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.clear();
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
+    m_journal.emplace(m_platform.files, OrderFolder(m_state.transfer.OrderFolder));
+    m_notKeptTold = false;
+}
+
+void HttpSender::keep(const Result<void>& written) {
+    if (written || m_notKeptTold)
+        return;
+    m_notKeptTold = true;
+    m_events.brokenNotKept(written.failure());
 }
 
 void HttpSender::leave() {
@@ -76,6 +84,8 @@ std::optional<SendingPhase> HttpSender::HttpAttempts() {
 
 std::optional<SendingPhase> HttpSender::sendMissing(int) {
     const QStringList files = lists.List4Hossarim.items();
+    if (m_journal)
+        keep(m_journal->sendingBegins(Sender::Http, false));
     m_left = static_cast<int>(files.size());
     m_allPosted = true;
     for (int i = 0; i < files.size(); ++i) {
@@ -224,12 +234,41 @@ void HttpSender::downloadList(int listNumber) {
     }
 }
 
-void HttpSender::HttpSendReport() const {
-    (void)FetchUrl(m_state.profile.ReportUrl + OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot));
+void HttpSender::keepArrival() {
+    if (!m_journal)
+        return;
+    keep(m_journal->arrived(true));
 }
 
-void HttpSender::HttpSendDone() const {
-    (void)FetchUrl(m_state.profile.HttpDoneUrl + DoneQuery(m_state.profile, m_state.transfer));
+void HttpSender::tellLab() {
+    if (!m_journal)
+        return;
+    ReportOnce reports(m_state, m_platform.files, *m_journal);
+    reports.tell(Sender::Http, *this);
+    keep(reports.kept());
+}
+
+bool HttpSender::keepFoundThere() {
+    if (!m_journal)
+        return false;
+    keepArrival();
+    ReportOnce reports(m_state, m_platform.files, *m_journal);
+    const bool due = reports.isDueWhereFound(Sender::Http);
+    keep(reports.kept());
+    return due;
+}
+
+void HttpSender::reportOrder(const QString& query) {
+    HttpSendReport(query);
+    HttpPause(2);
+}
+
+void HttpSender::HttpSendReport(const QString& query) const {
+    (void)FetchUrl(m_state.profile.ReportUrl + query);
+}
+
+void HttpSender::HttpSendDone(const QString& query) const {
+    (void)FetchUrl(m_state.profile.HttpDoneUrl + query);
 }
 
 void HttpSender::postTestPicture() {

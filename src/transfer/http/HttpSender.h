@@ -1,10 +1,13 @@
 #pragma once
 
+#include "order/OrderJournal.h"
 #include "session/TextList.h"
 #include "transfer/delivery/Attempts.h"
 #include "transfer/http/ServerList.h"
 #include "transfer/http/UploadScript.h"
+#include "transfer/report/ReportOnce.h"
 
+#include <optional>
 #include <utility>
 #include <vector>
 
@@ -32,13 +35,13 @@ struct HttpLists {
 
 // Sends one order by HTTP, file by file, and asks scripts on the lab's web server which files have arrived. Only the
 // server's list tells success, never the answer to an upload.
-class HttpSender final : private Attempts {
+class HttpSender final : private Attempts, private ReportCalls {
 public:
     static constexpr int attempts = 3;
 
     HttpSender(SessionState& state, const Platform& platform, SendingEvents& events);
 
-    // Fills List4Kvazim with the files of the order's folder; empty when no folder is set.
+    // Begins an order: fills List4Kvazim with the files of its folder; empty when no folder is set.
     void BuildOrderFileList();
     // The customer leaves: the call of the line that is under way is cut.
     void leave();
@@ -53,9 +56,16 @@ public:
     // Up to three attempts. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> HttpAttempts();
 
-    // The answers of both calls are ignored: the order is on the server.
-    void HttpSendReport() const;
-    void HttpSendDone() const;
+    // The order lies on the server: keeps that, and tells the lab where it is to be told.
+    void keepArrival();
+    void tellLab();
+    // The files of the folder lay on the server before anything was sent. True when the lab has yet to be told of the
+    // order.
+    bool keepFoundThere();
+
+    // The answers of both calls are ignored.
+    void HttpSendReport(const QString& query) const;
+    void HttpSendDone(const QString& query) const;
     void HttpPause(int times = 1);
 
     // The lab's tests of its scripts; the answers are in TxtWeb.
@@ -71,6 +81,10 @@ private:
     std::optional<SendingPhase> checkArrival(int attempt) override;
     SendingPhase afterTheLast() override { return SendingPhase::NotAll; }
 
+    void reportOrder(const QString& query) override;
+    void reportDone(const QString& query) override { HttpSendDone(query); }
+
+    void keep(const Result<void>& written);
     void post(const QString& path);
     void downloadList(int listNumber);
     void tellMissing();
@@ -82,6 +96,8 @@ private:
     SessionState& m_state;
     const Platform& m_platform;
     UploadScript m_script;
+    std::optional<OrderJournal> m_journal;
+    bool m_notKeptTold = false; // a step that could not be kept is told once an order
     int m_listNumber = 1;
     int m_left = 0;          // files of the pass not yet posted
     bool m_allPosted = true; // every file of the last pass was posted

@@ -1,6 +1,5 @@
 #include "transfer/http/UploadForm.h"
 
-#include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
@@ -92,18 +91,13 @@ void UploadForm::findMissing() {
         startPanel();
         return;
     }
-    Pic4Timer.visible = Image4.visible = Picture5.visible = false;
-    Picture1.visible = true;
     stopTimers();
-    OrderJournal journal = orderJournal();
-    static_cast<void>(journal.arrived(true));
-    static_cast<void>(journal.needsNoReport());
-    enter(SendingPhase::AllThere);
-}
-
-// What can't be written of it only leads to one more offer to go on: the server's list decides then too.
-OrderJournal UploadForm::orderJournal() const {
-    return {m_platform.files, OrderFolder::chosen(m_state)};
+    Pic4Timer.visible = Image4.visible = Picture5.visible = false;
+    if (m_sender.keepFoundThere()) {
+        succeed();
+        return;
+    }
+    endAllThere();
 }
 
 void UploadForm::growPanel() {
@@ -165,7 +159,6 @@ void UploadForm::sendMissing() {
     Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
     Command15.enabled = true;
     forgetReason();
-    static_cast<void>(orderJournal().sendingBegins(Sender::Http, false));
     const std::optional<SendingPhase> end = m_sender.HttpAttempts();
     if (!end)
         return;
@@ -181,6 +174,14 @@ void UploadForm::sendMissing() {
     enter(*end);
 }
 
+void UploadForm::endAllThere() {
+    Label1.text.clear();
+    m_attemptFailed = false;
+    forgetReason();
+    Picture1.visible = true;
+    enter(SendingPhase::AllThere);
+}
+
 void UploadForm::succeed() {
     percent = 100;
     Label7.text = u"100"_s;
@@ -190,19 +191,10 @@ void UploadForm::succeed() {
     m_attemptFailed = false;
     forgetReason();
     enter(SendingPhase::Reporting);
-    OrderJournal journal = orderJournal();
-    static_cast<void>(journal.arrived(true));
+    m_sender.keepArrival();
     m_sender.HttpPause(2);
-    if (m_state.transfer.SugMishloah != Sending::NewOrder) {
-        static_cast<void>(journal.needsNoReport());
-    } else if (!m_sender.stop.left) {
-        static_cast<void>(journal.reportBegun());
-        m_sender.HttpSendReport();
-        m_sender.HttpPause(2);
-        m_sender.HttpSendDone();
-        if (!m_sender.stop.left)
-            static_cast<void>(journal.reportDone());
-    }
+    if (!m_sender.stop.left)
+        m_sender.tellLab();
     if (m_sender.stop.left)
         return;
     Label9.visible = Pic4Hamten.visible = Picture1.visible = false;

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "order/OrderJournal.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/SendingPage.h"
 #include "transfer/http/HttpSender.h"
@@ -106,7 +105,7 @@ private:
     void sendAgain();
     void sendMissing();
     void succeed();
-    OrderJournal orderJournal() const;
+    void endAllThere();
     void leaveForAnother();
 
     // UploadFormTexts.cpp
@@ -128,7 +127,7 @@ private:
     void sending(int index, int count, const QString& name) override;
     void pieceSent(double, std::optional<int>) override {}
     void failed(LineStep step, const Failure& failure, const QString& subject) override;
-    void brokenNotKept(const Failure&) override {}
+    void brokenNotKept(const Failure& failure) override;
     void enteredFolder(int, const QString&, const QString&) override {}
     void pausing(int round) override;
 

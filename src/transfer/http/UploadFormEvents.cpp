@@ -1,5 +1,7 @@
 // Shows the events of a sending by HTTP in the page's controls and words.
 #include "order/OrderFolder.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
 
@@ -70,6 +72,10 @@ void UploadForm::progressed(int index, int count) {
 void UploadForm::failed(LineStep step, const Failure& failure, const QString& subject) {
     tellReason(step, failure, subject);
     showTrouble();
+}
+
+void UploadForm::brokenNotKept(const Failure& failure) {
+    m_platform.dialogs.message(failure.message);
 }
 
 void UploadForm::pausing(int round) {

@@ -27,9 +27,16 @@ QString InetForm::FetchUrlSmall(const QString& url) {
     return body ? AnsiCodePage::decode(*body) : QString();
 }
 
-void InetForm::reportOrder() {
+QString InetForm::orderQuery() const {
+    return OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
+}
+
+QString InetForm::doneQuery() const {
+    return DoneQuery(m_state.profile, m_state.transfer);
+}
+
+void InetForm::reportOrder(const QString& query) {
     m_platform.pump.pump();
-    const QString query = OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
     const QString& script = m_state.profile.ReportUrl;
     // The lab's site expects a call of this address before each report.
     TeshuvatSharat = FetchUrlSmall(script + u"c.txt"_s);
@@ -37,8 +44,8 @@ void InetForm::reportOrder() {
     Q_EMIT changed();
 }
 
-void InetForm::reportDone() {
-    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + DoneQuery(m_state.profile, m_state.transfer));
+void InetForm::reportDone(const QString& query) {
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + query);
     Q_EMIT changed();
 }
 

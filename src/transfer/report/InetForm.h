@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "common/Result.h"
 #include "session/Page.h"
+#include "transfer/report/ReportOnce.h"
 
 namespace lumora {
 
@@ -13,7 +14,7 @@ struct SessionState;
 // InetForm, "the two reports" in the glossary: a page without a view, by which the sending page tells the lab's web
 // site that an order has arrived. Nothing reads the answers, and a lost report changes nothing: the order is on the
 // server.
-class InetForm : public Page {
+class InetForm : public Page, public ReportCalls {
     Q_OBJECT
 public:
     static constexpr PageId pageId = PageId::InetForm;
@@ -21,11 +22,11 @@ public:
     InetForm(const SessionState& state, const Platform& platform, PageChain& chain);
 
     // Events.
-    void Command1_Click() { reportOrder(); }
-    void Command2_Click() { reportDone(); }
+    void Command1_Click() { reportOrder(orderQuery()); }
+    void Command2_Click() { reportDone(doneQuery()); }
 
-    void reportOrder();
-    void reportDone();
+    void reportOrder(const QString& query) override;
+    void reportDone(const QString& query) override;
 
     // State.
     const QString& answer() const { return TeshuvatSharat; } // of the last call
@@ -34,6 +35,9 @@ public:
     QString FetchUrlSmall(const QString& url);
 
 private:
+    QString orderQuery() const;
+    QString doneQuery() const;
+
     const SessionState& m_state;
     const Platform& m_platform;
     QString TeshuvatSharat;

@@ -5,14 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include <Poco/Net/ServerSocket.h>
-#include <Poco/Net/SocketAddress.h>
-#include <Poco/Net/StreamSocket.h>
-
-#include <array>
-#include <atomic>
 #include <filesystem>
-#include <thread>
 
 // A prepared order, the page that sends by HTTP, and real web servers that run the lab's scripts.
 namespace lumora {
@@ -72,34 +65,6 @@ TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
     relay.setFaults({.cutDataAfter = 20, .times = 2});
     rig.countDown();
     expectArrived(lab.uploads());
-}
-
-TEST_F(SendByHttp, AServerThatClosesInTheMiddleOfAFileIsAFailureThatIsTold) {
-    // Takes a little of each request and resets the line.
-    Poco::Net::ServerSocket server(Poco::Net::SocketAddress("127.0.0.1", 0));
-    std::atomic<bool> stop = false;
-    std::thread closing([&] {
-        while (!stop) {
-            if (!server.poll(Poco::Timespan(0, 20'000), Poco::Net::Socket::SELECT_READ))
-                continue;
-            Poco::Net::StreamSocket line = server.acceptConnection();
-            std::array<char, 600> some;
-            line.receiveBytes(some.data(), static_cast<int>(some.size()));
-            line.setLinger(true, 0);
-            line.close();
-        }
-    });
-    rig.state.profile.HttpHost = u"http://127.0.0.1:%1"_s.arg(server.address().port());
-    UploadForm& page = rig.send();
-    stop = true;
-    closing.join();
-    EXPECT_EQ(page.look().sign, SendingSign::Bad);
-    EXPECT_TRUE(page.controls().Label4Reason.visible);
-    EXPECT_EQ(page.lists().List4Hossarim.count(), 5);
-    rig.state.profile.HttpHost = lab.site();
-    page.Image5_Click();
-    expectArrived(lab.uploads());
-    EXPECT_EQ(lab.reports().size(), 2);
 }
 
 TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
