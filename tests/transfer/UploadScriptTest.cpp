@@ -81,7 +81,7 @@ TEST(ServerListTest, ATextOf35CharactersIsNoListing) {
               QStringList({u"2026_11_21_KUP_1234^105"_s, u"ab"_s, u"total:1"_s}));
 }
 
-TEST(ServerListTest, AnEntryStrikesOneNameThatContainsIt) {
+TEST(ServerListTest, AnEntryStrikesOneNameThatContainsItOrCarefullyIsIt) {
     const QString folder = u"2026_11_21_KUP_1234^105"_s;
     const QString log = u"C:\\o\\2026_11_21_KUP_1234^105.txt"_s;
     const QString small = u"C:\\o\\1.jpp"_s;
@@ -89,16 +89,22 @@ TEST(ServerListTest, AnEntryStrikesOneNameThatContainsIt) {
     const struct {
         QStringList entries;
         QStringList left;
+        QStringList leftByWholeNames;
     } cases[] = {
-        {{folder, u"total:3"_s}, {log, large, small}},
-        {{folder, log.mid(5), u"total:1"_s}, {large, small}},
-        {{u" 11.jpp "_s}, {log, small}},
-        {{u"1.jpp"_s}, {log, small}}, // taken as arrived: its name contains the listed one
-        {{u"1.jpp"_s, u"1.JPP"_s}, {log}},
-        {{u"..\\..\\x"_s, u"C:\\o\\1.jpp"_s}, {log, large, small}},
+        {{folder, u"total:3"_s}, {log, large, small}, {log, large, small}},
+        {{folder, log.mid(5), u"total:1"_s}, {large, small}, {large, small}},
+        {{u" 11.jpp "_s}, {log, small}, {log, small}},
+        {{u"1.jpp"_s}, {log, small}, {log, large}}, // taken as arrived: its name contains the listed one
+        {{u"1.jpp"_s, u"1.JPP"_s}, {log}, {log, large}},
+        {{u"."_s, u"jpp"_s, u"txt"_s}, {small}, {log, large, small}},
+        {{u"..\\..\\x"_s, u"C:\\o\\1.jpp"_s}, {log, large, small}, {log, large, small}},
     };
-    for (const auto& c : cases)
-        EXPECT_EQ(MarkHossarim({log, large, small}, c.entries, folder), c.left) << c.entries.join(u'|').toStdString();
+    for (const auto& c : cases) {
+        const QStringList files = {log, large, small};
+        EXPECT_EQ(MarkHossarim(files, c.entries, folder), c.left) << c.entries.join(u'|').toStdString();
+        EXPECT_EQ(MarkHossarim(files, c.entries, folder, ListMatch::Whole), c.leftByWholeNames)
+            << c.entries.join(u'|').toStdString();
+    }
 }
 
 TEST(ServerListTest, AListMustNameTheFolderAndATotalAndNoWhereSayNot) {

@@ -59,7 +59,11 @@ QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QS
     if (path.text().size() < shortestFolder)
         return {};
     QStringList paths = files.collect(path, Files::Depth::ThisFolder);
-    paths.removeIf([&](const QString& each) { return LeafName(each).compare(serverList, Qt::CaseInsensitive) == 0; });
+    const QString broken = OrderFolder(path).brokenFilesPath().leaf();
+    paths.removeIf([&](const QString& each) {
+        const QString name = LeafName(each);
+        return name.compare(serverList, Qt::CaseInsensitive) == 0 || name.compare(broken, Qt::CaseInsensitive) == 0;
+    });
     return paths;
 }
 

@@ -17,7 +17,8 @@ QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QS
 // The same for the older bulk path, chosen from the paths that the page of finished orders handed over.
 QStringList BulkFiles(const QStringList& handedOver, bool inPieces);
 
-// The files of a folder that HTTP sends: all but serverList, the file that an earlier check downloaded into the folder.
+// The files of a folder that HTTP sends: all but serverList, the file that an earlier check downloaded into the folder,
+// and the list of broken files that a sending by FTP left there.
 QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QString& serverList);
 
 } // namespace lumora

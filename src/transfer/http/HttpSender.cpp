@@ -30,7 +30,8 @@ HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEve
     : Attempts(events, stop)
     , m_state(state)
     , m_platform(platform)
-    , m_script(platform) {}
+    , m_script(platform)
+    , m_listGuard(state) {}
 
 QString HttpSender::folderName() const {
     return OrderFolder::chosen(m_state).name();
@@ -74,9 +75,7 @@ void HttpSender::tellMissing() {
 }
 
 std::optional<SendingPhase> HttpSender::HttpAttempts() {
-    // m_listNumber is the number of the next list file and also the count of missing files: after an attempt that
-    // missed more than three there is no such list file, and the whole order is sent again.
-    m_listNumber = 1;
+    m_listNumber = HttpListGuard::first;
     m_listFailure = {};
     const StoppableLine line(m_platform);
     return run(attempts);
@@ -120,7 +119,7 @@ void HttpSender::post(const QString& path) {
 
 std::optional<SendingPhase> HttpSender::checkArrival(int) {
     findMissing(m_listNumber);
-    m_listNumber = lists.List4Hossarim.count();
+    m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
     // A failed post explains more than the list that lacks the file.
     if (m_allPosted && !lists.List4Hossarim.isEmpty() && !m_stop.left)
         m_events.failed(listTrouble(), m_listFailure);
@@ -149,7 +148,8 @@ LineStep HttpSender::listTrouble() const {
 }
 
 void HttpSender::findMissing(int listNumber) {
-    if (CheckOrderOnServer(listNumber) != ServerVerdict::Listed) {
+    m_verdict = CheckOrderOnServer(listNumber);
+    if (m_verdict != ServerVerdict::Listed) {
         lists.List4Hossarim.clear();
         lists.List4Hossarim.append(lists.List4Kvazim.items());
     }
@@ -177,7 +177,8 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     // Files named in a list without a total count as arrived, but that list is not trusted: the whole order is sent
     // again.
     if (answer.namesFolder) {
-        const QStringList missing = MarkHossarim(lists.List4Kvazim.items(), lists.ListAfterWeb.items(), name);
+        const QStringList missing =
+            MarkHossarim(lists.List4Kvazim.items(), lists.ListAfterWeb.items(), name, m_listGuard.match());
         lists.List4Hossarim.clear();
         lists.List4Hossarim.append(missing);
         tellMissing();

@@ -3,6 +3,7 @@
 #include "order/OrderJournal.h"
 #include "session/TextList.h"
 #include "transfer/delivery/Attempts.h"
+#include "transfer/http/HttpListGuard.h"
 #include "transfer/http/ServerList.h"
 #include "transfer/http/UploadScript.h"
 #include "transfer/report/ReportOnce.h"
@@ -98,10 +99,12 @@ private:
     UploadScript m_script;
     std::optional<OrderJournal> m_journal;
     bool m_notKeptTold = false; // a step that could not be kept is told once an order
-    int m_listNumber = 1;
-    int m_left = 0;          // files of the pass not yet posted
-    bool m_allPosted = true; // every file of the last pass was posted
-    Failure m_listFailure;   // failure of the last list file's download; no message after success
+    HttpListGuard m_listGuard;
+    int m_listNumber = HttpListGuard::first;
+    ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check
+    int m_left = 0;                                       // files of the pass not yet posted
+    bool m_allPosted = true;                              // every file of the last pass was posted
+    Failure m_listFailure; // failure of the last list file's download; no message after success
 };
 
 } // namespace lumora

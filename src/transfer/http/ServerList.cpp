@@ -28,14 +28,16 @@ QStringList ParseServerList(const QString& text) {
     return entries;
 }
 
-QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName) {
+QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName,
+                         ListMatch match) {
     QStringList missing = files;
     for (const QString& given : entries) {
         const QString entry = given.trimmed().toLower();
         if (namesTotal(entry) || entry == folderName.toLower())
             continue;
         const auto arrived = std::find_if(missing.begin(), missing.end(), [&](const QString& path) {
-            return LeafName(path).trimmed().toLower().contains(entry);
+            const QString name = LeafName(path).trimmed().toLower();
+            return match == ListMatch::Whole ? name == entry : name.contains(entry);
         });
         if (arrived != missing.end())
             missing.erase(arrived);

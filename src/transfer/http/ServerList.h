@@ -9,10 +9,15 @@ namespace lumora {
 // with a number. A text of at most 35 characters is no listing and has no entries.
 QStringList ParseServerList(const QString& text);
 
-// The files of the order that a listing lacks, as full paths. A file has arrived when its name contains an entry,
-// regardless of case, so that a short entry also stands for a longer name. The folder's name and the total are skipped:
-// the log's name begins with the folder's name.
-QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName);
+enum class ListMatch {
+    Part, // an entry stands for a name that contains it, so that a short entry also stands for a longer name
+    Whole,
+};
+
+// The files of the order that a listing lacks, as full paths. A file has arrived when an entry matches its name,
+// regardless of case. The folder's name and the total are skipped: the log's name begins with the folder's name.
+QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName,
+                         ListMatch match = ListMatch::Part);
 
 // The result of a check of the server.
 enum class ServerVerdict : int {

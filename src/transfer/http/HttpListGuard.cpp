@@ -1,0 +1,16 @@
+#include "transfer/http/HttpListGuard.h"
+
+#include "session/SessionState.h"
+
+namespace lumora {
+
+ListMatch HttpListGuard::match() const {
+    return m_state.Careful ? ListMatch::Whole : ListMatch::Part;
+}
+
+int HttpListGuard::nextList(int missing, ServerVerdict verdict) const {
+    const bool thereIsOne = verdict == ServerVerdict::Listed && !ListFileName(missing).isEmpty();
+    return m_state.Careful && !thereIsOne ? first : missing;
+}
+
+} // namespace lumora
