@@ -1,3 +1,4 @@
+#include "order/OrderJournal.h"
 #include "support/FakeWebLab.h"
 #include "support/RecordedSending.h"
 #include "support/UploadFormRig.h"
@@ -92,6 +93,47 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
                       LineTroubleText(other.state, c.reason, {}, other.localFiles().rbegin()->first));
         }
     }
+}
+
+TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBrokenFiles) {
+    for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
+        for (const bool careful : {true, false}) {
+            FakeWebLab other;
+            UploadFormRig dead(other);
+            dead.state.Careful = careful;
+            dead.state.transfer.SugMishloah = sending;
+            dead.write(u"Kashloo.txt"_s, "C:\\a.jpp\r\n");
+            const OrderFolder order(UploadFormRig::folder());
+            const QString path = order.filePath(UploadFormRig::first()).text();
+            ASSERT_TRUE(OrderJournal(dead.test.files, order).take(path));
+            auto sent = dead.localFiles();
+            sent.erase(u"Kashloo.txt"_s);
+            other.uploads[UploadFormRig::name()] = sent;
+            other.uploads[UploadFormRig::name()][UploadFormRig::first()].chop(5);
+            OrderState meanwhile;
+            other.onPost = [&](const QString&) { meanwhile = ReadOrderState(dead.test.files, order).value(); };
+            EXPECT_EQ(dead.send().phase(), SendingPhase::Success);
+            EXPECT_EQ(other.posted, QStringList(UploadFormRig::first()));
+            EXPECT_EQ(meanwhile.filesInHand, QStringList(path));
+            EXPECT_EQ(meanwhile.phase, OrderState::Phase::Sending);
+            EXPECT_EQ(other.uploads[UploadFormRig::name()], sent);
+            const OrderState after = ReadOrderState(dead.test.files, order).value();
+            EXPECT_TRUE(after.filesInHand.isEmpty());
+            EXPECT_EQ(after.phase, OrderState::Phase::Reported);
+        }
+    }
+}
+
+TEST_F(UploadFormTest, AnOrderWithoutPicturesCarefullyDoesNotLeave) {
+    for (const QString& print : {UploadFormRig::first(), UploadFormRig::second(), UploadFormRig::third()})
+        ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() / print));
+    rig.state.Careful = true;
+    EXPECT_EQ(rig.start().phase(), SendingPhase::NoOrder);
+    EXPECT_EQ(rig.test.dialogs.messages.size(), 1);
+    EXPECT_TRUE(lab.urls.isEmpty());
+    rig.state.Careful = false;
+    rig.page().Command2_Click();
+    EXPECT_EQ(rig.page().phase(), SendingPhase::Countdown);
 }
 
 TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverItIsFound) {

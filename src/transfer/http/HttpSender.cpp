@@ -56,6 +56,12 @@ void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
     m_journal.emplace(m_platform.files, OrderFolder(m_state.transfer.OrderFolder));
     m_notKeptTold = false;
+    takeLeftBehind();
+}
+
+void HttpSender::takeLeftBehind() {
+    m_leftBehind = m_journal->state().filesInHand;
+    m_leftBehind.removeIf([this](const QString& path) { return !lists.List4Kvazim.contains(path); });
 }
 
 void HttpSender::keep(const Result<void>& written) {
@@ -104,7 +110,11 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
 void HttpSender::post(const QString& path) {
     const DrivePath folder = DrivePath(path).folder();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
+    if (m_journal)
+        keep(m_journal->take(path));
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
+    if (m_journal && (!m_script.failed() || (m_script.failedBeforeSending() && !m_leftBehind.contains(path))))
+        keep(m_journal->release(path));
     m_events.reached(SendingMoment::Answered);
     if (m_script.failed()) {
         m_allPosted = false;
@@ -113,6 +123,7 @@ void HttpSender::post(const QString& path) {
         m_events.failed(m_script.failedBeforeSending() ? LineStep::File : LineStep::Put, m_script.lastFailure(),
                         LeafName(path));
     } else {
+        m_leftBehind.removeAll(path);
         m_events.reached(SendingMoment::Posted, --m_left);
     }
 }
@@ -152,6 +163,10 @@ void HttpSender::findMissing(int listNumber) {
     if (m_verdict != ServerVerdict::Listed) {
         lists.List4Hossarim.clear();
         lists.List4Hossarim.append(lists.List4Kvazim.items());
+    }
+    for (const QString& path : std::as_const(m_leftBehind)) {
+        if (!lists.List4Hossarim.contains(path))
+            lists.List4Hossarim.append(path);
     }
     tellMissing();
 }
@@ -238,6 +253,9 @@ void HttpSender::downloadList(int listNumber) {
 void HttpSender::keepArrival() {
     if (!m_journal)
         return;
+    const QStringList inHand = m_journal->state().filesInHand;
+    for (const QString& path : inHand)
+        keep(m_journal->release(path));
     keep(m_journal->arrived(true));
 }
 

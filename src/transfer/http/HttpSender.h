@@ -85,6 +85,7 @@ private:
     void reportOrder(const QString& query) override;
     void reportDone(const QString& query) override { HttpSendDone(query); }
 
+    void takeLeftBehind();
     void keep(const Result<void>& written);
     void post(const QString& path);
     void downloadList(int listNumber);
@@ -99,6 +100,8 @@ private:
     UploadScript m_script;
     std::optional<OrderJournal> m_journal;
     bool m_notKeptTold = false; // a step that could not be kept is told once an order
+    // Full paths that an earlier sending had in hand as it ended: half a file may lie on the server under its name.
+    QStringList m_leftBehind;
     HttpListGuard m_listGuard;
     int m_listNumber = HttpListGuard::first;
     ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check

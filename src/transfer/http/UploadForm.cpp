@@ -1,8 +1,11 @@
 #include "transfer/http/UploadForm.h"
 
+#include "common/DrivePath.h"
+#include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
+#include "transfer/delivery/CompletenessGuard.h"
 #include "transfer/delivery/StoppableLine.h"
 
 #include <algorithm>
@@ -78,6 +81,11 @@ void UploadForm::findMissing() {
         enter(SendingPhase::NoServer);
         return;
     }
+    if (!mayBeSent()) {
+        if (!m_sender.stop.left)
+            enter(SendingPhase::NoOrder);
+        return;
+    }
     m_busy = true;
     enter(SendingPhase::Preparing);
     {
@@ -98,6 +106,13 @@ void UploadForm::findMissing() {
         return;
     }
     endAllThere();
+}
+
+bool UploadForm::mayBeSent() {
+    QStringList names;
+    for (const QString& path : lists().List4Kvazim.items())
+        names += LeafName(path);
+    return CompletenessGuard(m_state, m_platform).maySend(OrderFolder::chosen(m_state), names) && !m_sender.stop.left;
 }
 
 void UploadForm::growPanel() {

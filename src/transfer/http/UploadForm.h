@@ -100,6 +100,7 @@ private:
     void startPanel();
     void refreshList();
     void findMissing();
+    bool mayBeSent();
     void stopCount();
     void goOn();
     void sendAgain();
