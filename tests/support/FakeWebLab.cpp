@@ -64,7 +64,7 @@ Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& reque
     const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
     uploads[folder];
     if (!strikes(losses[name]))
-        uploads[folder][name] = request.body.mid(from, end - from);
+        uploads[folder][name] = request.body.mid(from, strikes(halves[name]) ? (end - from) / 2 : end - from);
     return QByteArray("stored");
 }
 
@@ -74,7 +74,7 @@ Result<std::optional<qint64>> FakeWebLab::contentLength(const QString& url) {
         return down();
     const QString folder = between(url, u"/uploads/"_s, u"/"_s);
     const QString name = url.mid(url.lastIndexOf(u'/') + 1);
-    if (!uploads.contains(folder) || !uploads[folder].contains(name))
+    if (tellsNoLength || !uploads.contains(folder) || !uploads[folder].contains(name))
         return std::optional<qint64>();
     return std::optional<qint64>(uploads[folder][name].size());
 }

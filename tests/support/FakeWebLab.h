@@ -19,6 +19,8 @@ public:
     int deadCalls = 0;                     // the same of fetches and downloads
     int deadReports = 0;                   // the same of calls that are no list
     std::map<QString, int> losses;         // how often a file is accepted and not stored
+    std::map<QString, int> halves;         // how often half of a file is stored behind a good answer
+    bool tellsNoLength = false;            // to HEAD
     std::optional<QByteArray> listInstead; // what each list file says
     bool refusesLists = false;             // no list file is given out
     std::function<void(const QString& name)> onPost;

@@ -1,4 +1,5 @@
 #include "order/OrderJournal.h"
+#include "order/OrderLog.h"
 #include "support/FakeWebLab.h"
 #include "support/RecordedSending.h"
 #include "support/UploadFormRig.h"
@@ -124,6 +125,46 @@ TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBroke
     }
 }
 
+TEST_F(UploadFormTest, CarefullyAFileArrivesInItsLength) {
+    struct Case {
+        const char* fault;
+        int halves;
+        bool tellsNoLength;
+        SendingPhase end;
+        int posted;
+        bool whole;
+        bool byNameOnly;
+    };
+    const Case cases[] = {
+        {"none", 0, false, SendingPhase::Success, 5, true, false},
+        {"half of a file stored, once", 1, false, SendingPhase::Success, 6, true, false},
+        {"half of a file stored, always", FakeLab::always, false, SendingPhase::NotAll, 7, false, false},
+        {"no HEAD", 0, true, SendingPhase::Success, 5, true, true},
+        {"no HEAD, half of a file stored", 1, true, SendingPhase::Success, 5, false, true},
+    };
+    for (const bool careful : {true, false}) {
+        for (const auto& c : cases) {
+            SCOPED_TRACE(std::string(c.fault) + (careful ? ", careful" : ""));
+            FakeWebLab other;
+            UploadFormRig cut(other);
+            cut.state.Careful = careful;
+            other.halves[UploadFormRig::first()] = c.halves;
+            other.tellsNoLength = c.tellsNoLength;
+            EXPECT_EQ(cut.send().phase(), careful ? c.end : SendingPhase::Success);
+            EXPECT_EQ(other.posted.size(), careful ? c.posted : 5);
+            EXPECT_EQ(other.uploads[UploadFormRig::name()] == cut.localFiles(), careful ? c.whole : c.halves == 0);
+            if (!c.tellsNoLength) {
+                EXPECT_EQ(other.urls.filter(u"/uploads/"_s).filter(UploadFormRig::second()).size(), careful ? 1 : 0)
+                    << "a file that is proven is not asked for again";
+            }
+            if (c.end == SendingPhase::Success) {
+                EXPECT_EQ(ReadOrderState(cut.test.files, OrderFolder(UploadFormRig::folder()))->provenByNameOnly,
+                          !careful || c.byNameOnly);
+            }
+        }
+    }
+}
+
 TEST_F(UploadFormTest, AnOrderWithoutPicturesCarefullyDoesNotLeave) {
     for (const QString& print : {UploadFormRig::first(), UploadFormRig::second(), UploadFormRig::third()})
         ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() / print));
@@ -134,6 +175,19 @@ TEST_F(UploadFormTest, AnOrderWithoutPicturesCarefullyDoesNotLeave) {
     rig.state.Careful = false;
     rig.page().Command2_Click();
     EXPECT_EQ(rig.page().phase(), SendingPhase::Countdown);
+}
+
+TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesWithoutBeingReportedWhereTheCustomerWantsThat) {
+    const QStringList lines(4, u"021015GNBC:\\pics\\aabb.jpg"_s);
+    rig.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+    rig.write(UploadFormRig::log(),
+              OrderLog::of(rig.state, OrderLog::Layout::Plain, lines, {}, rig.test.clock.time).write());
+    rig.state.Careful = true;
+    rig.test.dialogs.answers = {true};
+    EXPECT_EQ(rig.send().phase(), SendingPhase::AllThere);
+    EXPECT_TRUE(arrived());
+    EXPECT_EQ(lab.reports.size(), 0);
+    EXPECT_EQ(ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder()))->phase, OrderState::Phase::Sending);
 }
 
 TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverItIsFound) {

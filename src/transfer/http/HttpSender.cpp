@@ -31,7 +31,8 @@ HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEve
     , m_state(state)
     , m_platform(platform)
     , m_script(platform)
-    , m_listGuard(state) {}
+    , m_listGuard(state)
+    , m_arrival(state, platform, stop) {}
 
 QString HttpSender::folderName() const {
     return OrderFolder::chosen(m_state).name();
@@ -56,6 +57,7 @@ void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
     m_journal.emplace(m_platform.files, OrderFolder(m_state.transfer.OrderFolder));
     m_notKeptTold = false;
+    m_arrival.beginOrder();
     takeLeftBehind();
 }
 
@@ -112,6 +114,7 @@ void HttpSender::post(const QString& path) {
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
     if (m_journal)
         keep(m_journal->take(path));
+    m_arrival.forget(path);
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     if (m_journal && (!m_script.failed() || (m_script.failedBeforeSending() && !m_leftBehind.contains(path))))
         keep(m_journal->release(path));
@@ -136,7 +139,7 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
         m_events.failed(listTrouble(), m_listFailure);
     m_events.reached(SendingMoment::CheckEnds);
     if (lists.List4Hossarim.isEmpty())
-        return SendingPhase::Success;
+        return isWholeOrder() ? SendingPhase::Success : SendingPhase::AllThere;
     return std::nullopt;
 }
 
@@ -168,6 +171,9 @@ void HttpSender::findMissing(int listNumber) {
         if (!lists.List4Hossarim.contains(path))
             lists.List4Hossarim.append(path);
     }
+    if (lists.List4Hossarim.isEmpty() && !m_stop.left)
+        lists.List4Hossarim.append(m_arrival.unproven(lists.List4Kvazim.items(), lists.ListAfterWeb.items(),
+                                                      siteAddress(u"/uploads/"_s + folderName() + u'/')));
     tellMissing();
 }
 
@@ -250,13 +256,20 @@ void HttpSender::downloadList(int listNumber) {
     }
 }
 
+bool HttpSender::isWholeOrder() const {
+    QStringList names;
+    for (const QString& path : lists.List4Kvazim.items())
+        names += LeafName(path);
+    return m_arrival.isWholeOrder(OrderFolder(m_state.transfer.OrderFolder), names);
+}
+
 void HttpSender::keepArrival() {
     if (!m_journal)
         return;
     const QStringList inHand = m_journal->state().filesInHand;
     for (const QString& path : inHand)
         keep(m_journal->release(path));
-    keep(m_journal->arrived(true));
+    keep(m_journal->arrived(m_arrival.byNameOnly()));
 }
 
 void HttpSender::tellLab() {
@@ -268,7 +281,7 @@ void HttpSender::tellLab() {
 }
 
 bool HttpSender::keepFoundThere() {
-    if (!m_journal)
+    if (!m_journal || !isWholeOrder())
         return false;
     keepArrival();
     ReportOnce reports(m_state, m_platform.files, *m_journal);

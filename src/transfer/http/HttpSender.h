@@ -3,6 +3,7 @@
 #include "order/OrderJournal.h"
 #include "session/TextList.h"
 #include "transfer/delivery/Attempts.h"
+#include "transfer/http/HttpArrival.h"
 #include "transfer/http/HttpListGuard.h"
 #include "transfer/http/ServerList.h"
 #include "transfer/http/UploadScript.h"
@@ -85,6 +86,7 @@ private:
     void reportOrder(const QString& query) override;
     void reportDone(const QString& query) override { HttpSendDone(query); }
 
+    bool isWholeOrder() const;
     void takeLeftBehind();
     void keep(const Result<void>& written);
     void post(const QString& path);
@@ -103,6 +105,7 @@ private:
     // Full paths that an earlier sending had in hand as it ended: half a file may lie on the server under its name.
     QStringList m_leftBehind;
     HttpListGuard m_listGuard;
+    HttpArrival m_arrival;
     int m_listNumber = HttpListGuard::first;
     ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check
     int m_left = 0;                                       // files of the pass not yet posted

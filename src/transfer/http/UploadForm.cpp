@@ -183,6 +183,10 @@ void UploadForm::sendMissing() {
         succeed();
         return;
     }
+    if (*end == SendingPhase::AllThere) {
+        endAllThere();
+        return;
+    }
     m_attemptFailed = true;
     Label1.text = wording(u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
                           u"After three attempts the computer could not upload the whole order");
