@@ -13,6 +13,7 @@ from servers import ACCOUNT, PASSWORD, RealFtp, ScriptedFtp, WebLab, listen
 
 PICTURES = 3
 HERE = 'the order on this machine'
+NOT_KNOWN = 'arrived whole, whether the lab was told is not known'
 FOLDER = pathlib.Path(__file__).resolve().parent
 LAB = (FOLDER / 'lab.ini.in').read_text()
 
@@ -272,7 +273,7 @@ class Kill(Case):
 
     def run(self):
         super().run()
-        self.good = self.text in ('arrived whole', 'nothing was begun')
+        self.good = self.text in ('arrived whole', 'nothing was begun', NOT_KNOWN)
         return self if self.result else None
 
     def play_case(self):
@@ -284,7 +285,14 @@ class Kill(Case):
         # While the customer still chooses there is no order, and its folder may have been made just before.
         self.result = 'nothing was begun'
         begun = first and any(path.name == '.order' or path.name[0] != '.' for path in first.iterdir())
-        if begun:
+        state = (first / '.order').read_bytes() if begun else b''
+        if b'"Phase","reported"' in state or b'"Report","begun"' in state:
+            # It has arrived, and a report that may have been heard is not sent twice: nothing is offered.
+            arrived = any(route == 'REPORT' and '?' in path for route, path in self.web.asked)
+            self.result = 'arrived whole' if b'"Phase","reported"' in state else NOT_KNOWN
+            if self.missing():
+                self.result = 'LIE: files missing or damaged'
+        elif begun:
             self.first_proof = self.local_files().get('000.jpg')
             self.result = self.verdict(self.play('goon', 'ftp', healed=True))
             arrived = self.told() == 'arrived'
