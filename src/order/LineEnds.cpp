@@ -14,12 +14,8 @@ void LineEnds::add(QByteArrayView bytes) {
     }
 }
 
-bool LineEnds::explain(qint64 here, qint64 there) const {
-    const qint64 longer = there - here;
-    if (longer == 0)
-        return false;
-    const qint64 bareLf = lf - crlf;
-    return longer == -cr || longer == -crlf || longer == lf || longer == bareLf;
+std::array<qint64, 4> LineEnds::changes() const {
+    return {-cr, -crlf, lf, lf - crlf};
 }
 
 Result<LineEnds> LineEndsOf(const Files& files, const DrivePath& path) {

@@ -4,6 +4,8 @@
 
 #include <QByteArrayView>
 
+#include <array>
+
 namespace lumora {
 
 class DrivePath;
@@ -18,9 +20,9 @@ struct LineEnds {
 
     void add(QByteArrayView bytes); // the next bytes of the file
 
-    // Whether the length on the server is that of a file of this length here whose line ends were converted. Any other
-    // length is that of a file that was cut.
-    bool explain(qint64 here, qint64 there) const;
+    // By how many bytes the file becomes longer in each way of converting it: every CR dropped, the CR of each pair
+    // dropped, a CR put before each LF, and before each LF that has none. A file of any other length was cut.
+    std::array<qint64, 4> changes() const;
 
 private:
     bool m_afterCr = false;

@@ -3,6 +3,7 @@
 // behind it.
 #include <dlfcn.h>
 #include <poll.h>
+#include <sys/epoll.h>
 #include <sys/socket.h>
 #include <sys/syscall.h>
 #include <sys/time.h>
@@ -53,6 +54,11 @@ int clock_gettime(clockid_t clock, timespec* now) noexcept {
 int poll(pollfd* sockets, nfds_t count, int timeout) {
     return next<decltype(poll)>("poll")(sockets, count,
                                         timeout > 0 ? static_cast<int>(std::max(1L, timeout / hurry)) : timeout);
+}
+
+int epoll_wait(int waiting, epoll_event* events, int count, int timeout) {
+    return next<decltype(epoll_wait)>("epoll_wait")(
+        waiting, events, count, timeout > 0 ? static_cast<int>(std::max(1L, timeout / hurry)) : timeout);
 }
 
 int ppoll(pollfd* sockets, nfds_t count, const timespec* timeout, const sigset_t* signals) {

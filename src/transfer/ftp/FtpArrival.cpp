@@ -6,7 +6,7 @@
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
-#include <algorithm>
+#include <vector>
 
 namespace lumora {
 
@@ -105,14 +105,31 @@ std::optional<ArrivalProof> FtpArrival::proofOf(FtpConnection& connection, const
     return ArrivalProof::of(here, m_lengths, ArrivalProof::Names::Exact);
 }
 
-bool FtpArrival::explains(const QString& path, qint64 there) const {
-    const DrivePath file(path);
-    const Result<qint64> here = m_files.size(file);
-    const Result<LineEnds> ends = LineEndsOf(m_files, file);
-    return here && ends && ends->explain(*here, there);
+// A server that changes line ends does it in one way, to every file.
+bool FtpArrival::oneWayExplains(const QStringList& changed, const QList<RemoteFile>& there,
+                                const QStringList& whole) const {
+    std::vector<std::size_t> ways = {0, 1, 2, 3};
+    const auto keep = [&](const QString& path, qint64 longer) {
+        const Result<LineEnds> ends = LineEndsOf(m_files, DrivePath(path));
+        std::erase_if(ways, [&](std::size_t way) { return !ends || ends->changes().at(way) != longer; });
+    };
+    for (const QString& path : changed) {
+        const RemoteFile* entry = entryOf(there, LeafName(path));
+        const Result<qint64> here = m_files.size(DrivePath(path));
+        if (!entry || !entry->length || !here || *entry->length == *here)
+            return false;
+        keep(path, *entry->length - *here);
+    }
+    for (const QString& path : whole) {
+        if (ways.empty())
+            break;
+        keep(path, 0);
+    }
+    return !changed.isEmpty() && !ways.empty();
 }
 
-bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path) {
+bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path, const QStringList& paths,
+                                 const QList<RemoteFile>& there) {
     const QString name = LeafName(path);
     if (!decides() || m_firstLooked || isShared(name))
         return false;
@@ -125,16 +142,26 @@ bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path)
                 length = entry.length;
         }
     }
-    return length && explains(path, *length);
+    QStringList whole;
+    for (const QString& each : paths) {
+        const RemoteFile* entry = entryOf(there, LeafName(each));
+        const Result<qint64> here = m_files.size(DrivePath(each));
+        if (each != path && entry && here && entry->length == *here && !isShared(entry->name))
+            whole += each;
+    }
+    return oneWayExplains({path}, {{name, length}}, whole);
 }
 
 bool FtpArrival::lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const {
-    return !proof.broken.isEmpty() && std::all_of(proof.broken.begin(), proof.broken.end(), [&](const QString& name) {
-        const RemoteFile* entry = entryOf(m_lengths, name);
-        const auto path =
-            std::find_if(paths.begin(), paths.end(), [&](const QString& each) { return LeafName(each) == name; });
-        return entry && entry->length && path != paths.end() && explains(*path, *entry->length);
-    });
+    const auto pathsOf = [&](const QStringList& names) {
+        QStringList found;
+        for (const QString& path : paths) {
+            if (names.contains(LeafName(path)))
+                found += path;
+        }
+        return found;
+    };
+    return oneWayExplains(pathsOf(proof.broken), m_lengths, pathsOf(proof.byLength));
 }
 
 } // namespace lumora

@@ -34,8 +34,10 @@ public:
                                         const QList<RemoteFile>& there);
     // Behind a put that was answered well: true where the server has stored it with other line ends. Asked for the
     // first file of an order alone.
-    bool lineEndsChanged(FtpConnection& connection, const QString& path);
-    // True when line ends explain each file of the proof that is broken, of which there is one at least.
+    bool lineEndsChanged(FtpConnection& connection, const QString& path, const QStringList& paths,
+                         const QList<RemoteFile>& there);
+    // True when one way of changing line ends explains each file of the proof that is broken, of which there is one at
+    // least, and no file that lies there whole disproves it.
     bool lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const;
 
 private:
@@ -45,7 +47,7 @@ private:
     };
     std::optional<Found> lengthsOf(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there);
     std::optional<qint64> ask(FtpConnection& connection, const QString& name);
-    bool explains(const QString& path, qint64 there) const;
+    bool oneWayExplains(const QStringList& changed, const QList<RemoteFile>& there, const QStringList& whole) const;
 
     const SessionState& m_state;
     const Files& m_files;

@@ -243,7 +243,7 @@ std::optional<ArrivalProof> FtpSession::prove(const QStringList& paths) {
 }
 
 bool FtpSession::lineEndsChanged(const QString& path) {
-    return hConnection && m_arrival.lineEndsChanged(*hConnection, path);
+    return hConnection && m_arrival.lineEndsChanged(*hConnection, path, m_lists.List4Makor.items(), m_inFolder);
 }
 
 bool FtpSession::lineEndsExplain(const ArrivalProof& proof, const QStringList& paths) const {
