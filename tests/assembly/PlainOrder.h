@@ -74,7 +74,7 @@ protected:
     // The customer leaves the program while the third of eight pictures is prepared.
     template <class P>
     void leaveAtTheThird(P& page, void (P::*start)(), void (P::*leave)()) {
-        machine.pump.onPump = [this, &page, leave] {
+        machine.pump.onPump = [&page, leave] {
             if (page.controls().Label17.text == u"3"_s)
                 (page.*leave)();
         };
