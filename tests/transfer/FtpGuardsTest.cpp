@@ -110,6 +110,10 @@ TEST(FtpGuards, AnOrderWithoutPicturesDoesNotLeave) {
             if (careful && each.questions > 0) {
                 EXPECT_TRUE(order.rig.test.dialogs.questions[0].contains(u"2 תמונות, ורק 1"_s));
             }
+            if (careful && each.phase == SendingPhase::NoOrder) {
+                order.rig.page().Command4_Click();
+                EXPECT_TRUE(order.lab.puts.isEmpty()) << "no other button sends what was refused";
+            }
         }
     }
 }

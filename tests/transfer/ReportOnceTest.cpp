@@ -57,7 +57,7 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
         Phase phaseAfter;
         Report reportAfter;
     };
-    using enum Report;
+    using enum OrderState::Report;
     const Case cases[] = {
         {"FTP", false, Sender::Ftp, Sending::NewOrder, 1, Phase::Arrived, NotYet, Told::Now, Phase::Reported, Done},
         {"FTP, again", false, Sender::Ftp, Sending::Resend, 1, Phase::Reported, Done, Told::Now, Phase::Reported, Done},

@@ -44,6 +44,13 @@ void MoogMeret::finishOrder(const OrderFolder& folder) {
     if (!mayAct() || !order)
         return;
     const UnfinishedOrder unfinished = UnfinishedOrderOf(m_state, m_platform.files, folder, *order);
+    if (unfinished.gone > 0 && unfinished.gone == unfinished.pictures) {
+        m_platform.dialogs.message(
+            m_state.wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
+                .arg(unfinished.gone)
+                .arg(unfinished.pictures));
+        return;
+    }
     if (unfinished.gone > 0 && (!asks(u"%1 מתוך %2 התמונות אינן עוד במקומן. להמשיך בלעדיהן?",
                                       u"%1 of %2 pictures are no longer where they were. Go on without them?",
                                       {QString::number(unfinished.gone), QString::number(unfinished.pictures)}) ||

@@ -155,6 +155,7 @@ private:
     void countPictures();
     void ShowOrderSummary();
     void armCountdown();
+    void refuseOrder();
 
     // FtpFrmLabArea.cpp
     void refillAndSendInRounds();

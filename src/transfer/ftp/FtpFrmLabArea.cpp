@@ -22,8 +22,7 @@ void FtpFrm::refillAndSendInRounds() {
     m_sender.lists.List3.append(BulkFiles(m_handedOver, inPieces()));
     addProofPicture();
     if (!mayBeSent()) {
-        if (!m_sender.stop.left)
-            enter(SendingPhase::NoOrder);
+        refuseOrder();
         return;
     }
     m_sender.beginOrder();
@@ -34,7 +33,8 @@ void FtpFrm::refillAndSendInRounds() {
 void FtpFrm::sendInRounds() {
     if (isUnderWay(phase()) || phase() == SendingPhase::Success || m_sender.stop.left)
         return;
-    if (lists().List3.isEmpty()) {
+    // A list that no order has begun with is none to send.
+    if (lists().List3.isEmpty() || lists().List4Makor.isEmpty()) {
         m_platform.dialogs.message(u"list3 is empty"_s);
         return;
     }

@@ -77,12 +77,19 @@ void FtpFrm::ShowOrderSummary() {
         OrderSummaryPicture(Picture2Lines, m_state.english() ? Qt::LeftToRight : Qt::RightToLeft));
 }
 
+// What was listed must not be sent by another button either.
+void FtpFrm::refuseOrder() {
+    if (m_sender.stop.left)
+        return;
+    clearLists();
+    enter(SendingPhase::NoOrder);
+}
+
 void FtpFrm::armCountdown() {
     m_platform.pump.pump();
     countPictures();
     if (lists().List3.isEmpty() || !mayBeSent()) {
-        if (!m_sender.stop.left)
-            enter(SendingPhase::NoOrder);
+        refuseOrder();
         return;
     }
     m_sender.beginOrder();

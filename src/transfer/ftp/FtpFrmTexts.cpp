@@ -91,6 +91,12 @@ std::span<const PhaseLook> FtpFrm::looks() const {
 }
 
 QString FtpFrm::advice(const PhaseLook& row) const {
+    if (row.phase == SendingPhase::Unclear && !m_sender.check.freshCount)
+        return wording(
+            u"לא ניתן היה לקרוא בשרת מה הגיע. כדי לבדוק ולשלוח שוב יש ללחוץ על הלחצן שלח שוב. אם זה חוזר, יש "
+            u"להודיע לחנות.",
+            u"The server did not tell what has arrived. Press Send again to check and send once more. If "
+            u"this comes again, please tell the shop.");
     const QString text = wording(row.advice);
     return text.contains(u'%') ? text.arg(m_sender.check.NumOnServer).arg(m_sender.NumToSend) : text;
 }
@@ -98,7 +104,7 @@ QString FtpFrm::advice(const PhaseLook& row) const {
 void FtpFrm::showPhase(const PhaseLook& row) {
     using enum SendingButton;
     const bool underWay = isUnderWay(row.phase);
-    const bool ended = row.main == SendAgain;
+    const bool ended = row.main == SendAgain || row.phase == SendingPhase::CallLab;
     Command15.enabled = Command21.enabled = underWay && row.phase != SendingPhase::Reporting;
     Command15.visible = row.buttons.testFlag(Stop);
     Image5.visible = row.buttons.testFlag(SendNow);

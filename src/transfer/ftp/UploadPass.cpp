@@ -125,8 +125,9 @@ void UploadPass::UploadOneFile(int index) {
         return;
     if (m_session.folderIsForeign() && !m_stop.StopFlag) {
         const bool basketKept = !m_session.journal()->state().items.isEmpty();
-        endBy(basketKept ? SendingPhase::NumberTaken : SendingPhase::CallLab, LineStep::ForeignFolder,
-              {Failure::Kind::InUse, u"the folder on the server holds another order"_s});
+        const Failure why{Failure::Kind::InUse, u"the folder on the server holds another order"_s};
+        m_session.log(u' ' + why.message);
+        endBy(basketKept ? SendingPhase::NumberTaken : SendingPhase::CallLab, LineStep::ForeignFolder, why);
     }
     if (m_stop.StopFlag) {
         m_session.FtpCloseConnection();
