@@ -3,8 +3,8 @@
 #include "assembly/edited/KeptWork.h"
 #include "order/BasketLine.h"
 #include "order/PrintCode.h"
-#include "order/PrintFile.h"
 #include "order/PrintFileName.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -90,12 +90,9 @@ void Preparation::findPrints() {
         const DrivePath print = m_folder->filePath(PrintNameOf(line, i, m_state.Optint));
         if (!line.hasUsableName() || !m_platform.files.fileExists(print))
             continue;
-        if (m_there.isEmpty()) {
-            const Result<QByteArray> bytes = m_platform.files.read(print);
-            if (!bytes || !readPrintFile(*bytes, PrintFileShape::of(m_state.profile))) {
-                removePrints();
-                return;
-            }
+        if (m_there.isEmpty() && !PrintFits(m_state, m_platform.files, print)) {
+            removePrints();
+            return;
         }
         m_there += i;
     }
@@ -179,10 +176,11 @@ bool Preparation::writeLog(OrderLog::Layout layout) {
     return true;
 }
 
-// The replaced order's number is another's on the server; a station's order goes nowhere and needs no second making.
+// The replaced order's number belongs to another order on the server; where a picture has failed, the replaced order
+// may hold its only print. A station's order is never made again.
 void Preparation::removeWhatIsNotNeeded() const {
     const Files& files = m_platform.files;
-    if (!m_replaced.isEmpty() && files.folderExists(m_replaced) && m_replaced != m_folder->path())
+    if (m_failed.isEmpty() && !m_replaced.isEmpty() && files.folderExists(m_replaced) && m_replaced != m_folder->path())
         static_cast<void>(files.removeTree(m_replaced)); // the next start tries again
     const DrivePath kept = m_folder->filePath(u".kept"_s);
     if (m_journal->state().way == OrderState::Way::Station && files.folderExists(kept))

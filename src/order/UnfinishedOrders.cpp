@@ -7,8 +7,10 @@
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
+#include "order/OrderLog.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
+#include "order/PrintFile.h"
 #include "order/PrintFileName.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
@@ -40,6 +42,21 @@ bool pictureIsThere(const BasketLine& line, LineForm form, const SessionState& s
     const DrivePath picture = PictureOf(line, form, state);
     return files.fileExists(picture) ||
            (picture != line.path && files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf()));
+}
+
+// A name outside the code page is never found: its picture fails in any case.
+bool isGone(const QString& item, LineForm form, const SessionState& state, const Files& files,
+            const OrderFolder& folder) {
+    return !HasQuestionMark(item) && !pictureIsThere(BasketLine::split(item, form), form, state, files, folder);
+}
+
+// The replaced order may hold the only prints of what could not be prepared again.
+bool hasFailed(const Files& files, const OrderFolder& folder) {
+    OrderLog log;
+    const Result<QByteArray> bytes = files.read(folder.logPath());
+    if (bytes)
+        log.read(*bytes);
+    return !bytes || !log.failed.isEmpty();
 }
 
 bool canBeSent(const SessionState& session, const OrderState& state) {
@@ -108,7 +125,7 @@ void tidyOrders(const SessionState& state, const Files& files) {
         // Of the replaced order nothing was sent; one that a later sending has taken up is none any more.
         const DrivePath replaced = orders / order->replaces;
         const Result<OrderState> before = ReadOrderState(files, OrderFolder(replaced));
-        if (before && before->phase <= Phase::Prepared)
+        if (before && before->phase <= Phase::Prepared && !hasFailed(files, folder))
             static_cast<void>(files.removeTree(replaced));
     }
 }
@@ -131,18 +148,34 @@ UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files,
     if (order.phase != Phase::Preparing)
         return counted;
     const LineForm form = lineFormOf(order.kind);
+    bool fits = false; // told by the first print that is there
     for (int i = 0; i < order.items.size(); ++i) {
         const BasketLine line = BasketLine::split(order.items[i], form);
         if (!line.hasUsableName())
             continue;
         ++counted.pictures;
-        if (files.fileExists(folder.filePath(PrintNameOf(line, i, order.kind))))
+        const DrivePath print = folder.filePath(PrintNameOf(line, i, order.kind));
+        const bool isThere = files.fileExists(print);
+        if (isThere && counted.prepared == 0)
+            fits = PrintFits(state, files, print);
+        if (isThere && fits)
             ++counted.prepared;
-        // A name outside the code page is found by nobody: it fails in any case.
-        else if (!HasQuestionMark(order.items[i]) && !pictureIsThere(line, form, state, files, folder))
+        else if (isGone(order.items[i], form, state, files, folder))
             ++counted.gone;
     }
     return counted;
+}
+
+int GonePictures(const SessionState& state, const Files& files, const UnfinishedOrder& order) {
+    const LineForm form = lineFormOf(order.state.kind);
+    return static_cast<int>(std::count_if(order.state.items.begin(), order.state.items.end(), [&](const QString& item) {
+        return BasketLine::split(item, form).hasUsableName() && isGone(item, form, state, files, order.folder);
+    }));
+}
+
+bool PrintFits(const SessionState& state, const Files& files, const DrivePath& print) {
+    const Result<QByteArray> bytes = files.read(print);
+    return bytes && readPrintFile(*bytes, PrintFileShape::of(state.profile)).ok();
 }
 
 QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& files) {

@@ -43,6 +43,12 @@ Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Fil
 // Removes the order's folder with all that it holds.
 Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder);
 
+// How many pictures of the order's basket are no longer where they were, whether their prints are there or not.
+int GonePictures(const SessionState& state, const Files& files, const UnfinishedOrder& order);
+
+// True for a print file that reads in the shape that the lab asks for now: all prints of an order have one.
+bool PrintFits(const SessionState& state, const Files& files, const DrivePath& print);
+
 // Where the order keeps what a clean-up would take out of a scratch folder.
 DrivePath KeptWorkFolder(const OrderFolder& folder, const DrivePath& scratch);
 

@@ -260,14 +260,18 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
     };
     for (const Case& each : cases) {
         for (const bool careful : {true, false}) {
-            for (const bool basketKept : {true, false}) {
+            for (const auto& [basketKept, pictureThere] : {std::pair(true, true), {true, false}, {false, true}}) {
                 SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : "") +
-                             (basketKept ? ", basket kept" : ""));
+                             (basketKept ? ", basket kept" : "") + (pictureThere ? "" : ", picture gone"));
                 Guarded order(careful);
                 order.rig.chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
                 order.remote();
                 if (basketKept)
                     order.keep({u"021015GNBC:\\pics\\aabb.jpg"_s}, false);
+                EXPECT_TRUE(order.rig.test.files.makeFolder(DrivePath(u"C:\\pics"_s)));
+                if (pictureThere) {
+                    EXPECT_TRUE(order.rig.test.files.writeWhole(DrivePath(u"C:\\pics\\aabb.jpg"_s), "picture"));
+                }
                 each.arrange(order);
                 const FakeLab::Folder before = order.remote();
                 // On the server the next number is another's too.
@@ -281,7 +285,7 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
                     continue;
                 }
                 EXPECT_EQ(order.remote(), before);
-                if (!basketKept) {
+                if (!basketKept || !pictureThere) {
                     EXPECT_EQ(order.rig.page().phase(), SendingPhase::CallLab);
                     EXPECT_EQ(order.rig.page().controls().Label34.text, QString()) << "the first attempt alone";
                     EXPECT_TRUE(order.rig.page().controls().Label4Reason.text.contains(u"הזמנה אחרת"_s));

@@ -3,6 +3,7 @@
 #include "common/FixedText.h"
 #include "order/OrderChoices.h"
 #include "order/OrderFolder.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
@@ -27,7 +28,8 @@ void FtpFrm::prepareAgain() {
     const OrderFolder before = m_sender.session.journal()->folder();
     const bool plain = printsAsTheyAre(kept.kind);
     const Outcome next = plain ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;
-    if (!m_chain.canFollow(id(), next)) {
+    // Without its picture a print can't be made again, and the old order holds the only one.
+    if (!m_chain.canFollow(id(), next) || GonePictures(m_state, m_platform.files, {before, kept}) > 0) {
         tellForeign();
         finish(SendingPhase::CallLab);
         return;

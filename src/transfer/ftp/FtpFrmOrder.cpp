@@ -121,12 +121,17 @@ void FtpFrm::beginResend() {
         enter(SendingPhase::NoOrder);
         return;
     }
-    FtpLists& lists = m_sender.lists;
-    lists.List3.append(m_handedOver);
-    showFileCount(lists.List3.count());
-    ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
-    ShowOrderSummary();
-    addProofPicture();
+    if (m_handedOver.isEmpty()) {
+        // The proof picture alone would count as the order.
+        listFolder();
+    } else {
+        FtpLists& lists = m_sender.lists;
+        lists.List3.append(m_handedOver);
+        showFileCount(lists.List3.count());
+        ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
+        ShowOrderSummary();
+        addProofPicture();
+    }
     armCountdown();
 }
 

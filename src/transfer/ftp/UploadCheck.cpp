@@ -10,6 +10,7 @@
 #include "platform/files/Files.h"
 #include "transfer/delivery/OrderFiles.h"
 
+#include <algorithm>
 #include <array>
 #include <vector>
 
@@ -144,6 +145,10 @@ bool UploadCheck::wholeOrderThere() {
     const QStringList entries = m_files.names(order.path(), u"*.gbr;*.jpp;*.prk"_s);
     QStringList rest = FtpOrderFiles(m_files, order, entries, m_transfer.Mefurak == Travel::Pieces);
     rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
+    // What an earlier sending has not confirmed may lie there by half.
+    const QStringList unconfirmed = m_session.journal()->state().filesInHand + ReadBrokenFiles(m_files, order);
+    if (std::any_of(rest.begin(), rest.end(), [&](const QString& path) { return unconfirmed.contains(path); }))
+        return false;
     const std::optional<ArrivalProof> ofRest = m_session.prove(rest);
     if (!ofRest || !ofRest->proven())
         return false;
