@@ -9,6 +9,7 @@
 #include "order/OrderState.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -211,11 +212,13 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
 
 TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked) {
     chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+    state.profile.JppChunks = 56;
     const QString name = u"2026_11_22_KUP_1234^106"_s;
     const OrderFolder folder{DrivePath(orders) / name};
     const auto give = [&](bool withState, const QStringList& basket) {
         std::filesystem::create_directories(*test.drives.toHost(folder.path()));
-        write(name, u"1 1015GNB0000_016F6E65.jpp"_s);
+        EXPECT_TRUE(
+            test.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), examplePrint(state.profile)));
         OrderState order;
         order.number = u"106"_s;
         order.kind = OrderKind::Print;

@@ -2,6 +2,7 @@
 
 #include "order/OrderChoices.h"
 #include "order/OrderJournal.h"
+#include "order/OrderLog.h"
 #include "session/Workspace.h"
 #include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
@@ -30,7 +31,8 @@ protected:
         const OrderFolder folder(orders / leaf);
         EXPECT_TRUE(test.files.makeFolder(folder.path()));
         for (const QString& file : files)
-            EXPECT_TRUE(test.files.writeWhole(folder.filePath(file), "x"));
+            EXPECT_TRUE(
+                test.files.writeWhole(folder.filePath(file), file == print ? examplePrint(session.profile) : "x"));
         return folder;
     }
     OrderFolder give(const QString& leaf, const OrderState& state, const QStringList& files = {}) {
@@ -70,17 +72,28 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     OrderState again = inPhase(Phase::Prepared, u"104"_s);
     again.replaces = u"2026_11_21_KUP_1234^103"_s;
     give(again.replaces, inPhase(Phase::Prepared, u"103"_s), {print});
-    give(u"2026_11_21_KUP_1234^104"_s, again, {print});
+    const OrderFolder anew = give(u"2026_11_21_KUP_1234^104"_s, again, {print});
+    ASSERT_TRUE(test.files.writeWhole(
+        anew.logPath(), OrderLog::of(session, OrderLog::Layout::Plain, again.items, {}, QDateTime()).write()));
+    // A picture failed: the replaced order holds its only print.
+    OrderState lacking = inPhase(Phase::Prepared, u"108"_s);
+    lacking.replaces = u"2026_11_21_KUP_1234^107"_s;
+    give(lacking.replaces, inPhase(Phase::Prepared, u"107"_s), {print});
+    const OrderFolder lacks = give(u"2026_11_21_KUP_1234^108"_s, lacking, {print});
+    ASSERT_TRUE(test.files.writeWhole(
+        lacks.logPath(),
+        OrderLog::of(session, OrderLog::Layout::Plain, again.items, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
     // Not whole yet: the replaced order keeps its prints.
     OrderState underWay = inPhase(Phase::Preparing, u"106"_s);
     underWay.replaces = name;
     give(name, inPhase(Phase::Prepared), {print});
     give(u"2026_11_21_KUP_1234^106"_s, underWay);
     tidyOrders(session, test.files);
-    EXPECT_EQ(test.files.folders(orders), QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name,
-                                                       "2026_11_21_KUP_1234^106", "not an order"}));
+    EXPECT_EQ(test.files.folders(orders),
+              QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name, "2026_11_21_KUP_1234^106",
+                           lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
     EXPECT_FALSE(test.files.fileExists(orders / u"2026_11_21_KUP_1234^102" / u".log-there"));
-    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104"}))
+    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^108", "2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104"}))
         << "the replaced one waits";
 }
 
@@ -132,6 +145,8 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
     EXPECT_EQ(found[0].pictures, 3) << "a name that is too short has no print";
     EXPECT_EQ(found[0].prepared, 1) << "its own picture may be gone";
     EXPECT_EQ(found[0].gone, 1);
+    session.profile.JppChunks = 40;
+    EXPECT_EQ(UnfinishedOrders(session, test.files)[0].gone, 2) << "a print of another shape is made again";
 
     SessionState next;
     next.DiskRoot = session.DiskRoot;

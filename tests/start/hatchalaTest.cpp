@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -108,6 +109,7 @@ TEST_F(hatchalaTest, TheCountdownStartsByItself) {
 }
 
 TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
+    deployment.profile.JppChunks = 56;
     chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
     chain.registerPage(PageId::FtpFrm, [] { return std::make_unique<Page>(PageId::FtpFrm); });
     const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
@@ -117,7 +119,8 @@ TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
         order.number = number;
         order.kind = OrderKind::Print;
         EXPECT_TRUE(WriteOrderState(machine.files, folder, order));
-        EXPECT_TRUE(machine.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), "x"));
+        EXPECT_TRUE(machine.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s),
+                                             examplePrint(deployment.profile)));
         return folder;
     };
     OrderState preparing;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/PrintFile.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -21,7 +22,14 @@ inline SessionState exampleOrder() {
     state.shemot.ser = u"1234"_s;
     state.shemot.Girsa = u"4.00"_s;
     state.shemot.TotalPics = 13;
+    state.profile.JppChunks = 56;
+    state.profile.JppBase = 30;
     return state;
+}
+
+// A print file in the shape that the profile asks for; its picture is no real one.
+inline QByteArray examplePrint(const ClientProfile& profile) {
+    return *packPrintFile(QByteArray(5000, 'p'), PrintFileShape::of(profile), QByteArray(40, ' '));
 }
 
 } // namespace lumora
