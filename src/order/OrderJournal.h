@@ -35,11 +35,11 @@ public:
     // preparation. ours: this order has made it, or it is known to hold nothing of another order. An order that has
     // arrived stays so.
     Result<void> sendingBegins(Sender by, bool ours);
-    // A file's full path, before its put and behind the put that was confirmed.
+    // A file's full path, before its put and after the put that was confirmed.
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);
     Result<void> arrived(bool byNameOnly);
-    // Before report and done call, and behind them. A begin that could not be kept has not taken place.
+    // Before report and done call, and after them. A begin that could not be kept has not taken place.
     Result<void> reportBegun();
     Result<void> reportDone();
     // The order has arrived and the lab wants no report.

@@ -68,7 +68,7 @@ bool MoogMeret::mayBeMailed() {
             mayAct());
 }
 
-// Behind a stop, with the same files marked, the customer chooses whether what was sent is sent again.
+// After a stop, with the same files marked, the customer chooses whether what was sent is sent again.
 bool MoogMeret::asksToGoOn() {
     const int unsent = m_walk.count() - m_walk.count(PackageWalk::Fate::Sent);
     return m_state.Careful && m_phase == Phase::Walked && m_walk.count(PackageWalk::Fate::Sent) > 0 && unsent > 0 &&

@@ -9,7 +9,7 @@ namespace {
 constexpr int mostSilentFiles = 2;
 constexpr qint64 window = 300;               // seconds
 constexpr qint64 leastBytes = window * 1000; // in a window
-// Behind a longer gap the machine has slept or its clock was set.
+// After a longer gap the machine has slept or its clock was set.
 constexpr qint64 longestGap = 60; // seconds
 
 } // namespace

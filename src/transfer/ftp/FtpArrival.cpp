@@ -14,7 +14,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Behind so many names without an answer a server is not asked again.
+// After so many names without an answer a server is not asked again.
 constexpr int mostSilentSizes = 3;
 
 bool isShared(const QString& name) {
@@ -54,7 +54,7 @@ std::optional<qint64> FtpArrival::ask(FtpConnection& connection, const QString& 
     return length;
 }
 
-// SIZE is asked where the listing does not already tell the length of the file here, and is believed before it.
+// SIZE is asked where the listing does not already tell the length of the file here, and overrules the listing.
 std::optional<FtpArrival::Found> FtpArrival::lengthsOf(FtpConnection& connection, const QString& path,
                                                        const QList<RemoteFile>& there) {
     const QString name = LeafName(path);

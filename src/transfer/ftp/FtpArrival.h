@@ -32,7 +32,7 @@ public:
     // Of the files of a sending: full local paths. No value as built in, and where the line was cut meanwhile.
     std::optional<ArrivalProof> proofOf(FtpConnection& connection, const QStringList& paths,
                                         const QList<RemoteFile>& there);
-    // Behind a put that was answered well: true where the server has stored it with other line ends. Asked for the
+    // After a put that was answered well: true where the server has stored it with other line ends. Asked for the
     // first file of an order alone.
     bool lineEndsChanged(FtpConnection& connection, const QString& path, const QStringList& paths,
                          const QList<RemoteFile>& there);

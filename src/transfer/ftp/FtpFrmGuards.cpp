@@ -1,4 +1,4 @@
-// What the sending page asks before, during and behind a sending, so that no order is lost.
+// What the sending page asks before, during and after a sending, so that no order is lost.
 #include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "order/OrderChoices.h"

@@ -19,7 +19,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Behind so many names in a row without an answer a server is not asked again in this check.
+// After so many names in a row without an answer a server is not asked again in this check.
 constexpr int mostUnanswered = 3;
 
 // In an address these would end the path or begin an escape.

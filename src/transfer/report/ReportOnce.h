@@ -27,7 +27,7 @@ protected:
 // ReportOn is above 0, and a new order's by HTTP. Careful: at most once for an order, by whichever sender it has
 // arrived; an order that is sent again is told as its log has it, and signs that cut a query are encoded.
 //
-// A sending page calls tell() behind OrderJournal::arrived() with the journal of its order, and shows a failure of
+// A sending page calls tell() after OrderJournal::arrived() with the journal of its order, and shows a failure of
 // kept(): a step of the telling that could not be written to the order's folder.
 class ReportOnce {
 public:
