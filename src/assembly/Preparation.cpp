@@ -182,7 +182,7 @@ void Preparation::removeWhatIsNotNeeded() const {
     const Files& files = m_platform.files;
     if (m_failed.isEmpty() && !m_replaced.isEmpty() && files.folderExists(m_replaced) && m_replaced != m_folder->path())
         static_cast<void>(files.removeTree(m_replaced)); // the next start tries again
-    const DrivePath kept = m_folder->filePath(u".kept"_s);
+    const DrivePath kept = m_folder->keptWorkPath();
     if (m_journal->state().way == OrderState::Way::Station && files.folderExists(kept))
         static_cast<void>(files.removeTree(kept)); // hidden, and never sent
 }

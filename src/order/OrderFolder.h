@@ -35,6 +35,10 @@ public:
     // The log's path without its ending, by which the senders refer to the order.
     DrivePath logBase() const { return filePath(name()); }
     DrivePath brokenFilesPath() const { return filePath(QStringLiteral("kashloo.txt")); }
+    // Hidden, and never listed, sent or counted.
+    DrivePath statePath() const { return filePath(QStringLiteral(".order")); }
+    DrivePath keptWorkPath() const { return filePath(QStringLiteral(".kept")); } // a folder
+    DrivePath fetchedLogPath() const { return filePath(QStringLiteral(".log-there")); }
 
 private:
     DrivePath m_path;

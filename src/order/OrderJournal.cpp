@@ -43,6 +43,7 @@ void OrderJournal::makeKnown() {
         m_state.number.chop(1);
     m_state.serial = name.left(name.lastIndexOf(u'^')).section(u'_', -1);
     m_state.way = wayOf(SenderMadeFor(m_files, m_folder).value_or(Sender::Ftp));
+    m_state.sentBefore = m_sentAgain;
     m_known = true;
 }
 
@@ -81,16 +82,31 @@ Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
     makeKnown();
     OrderState next = m_state;
     next.folderMadeByUs = next.folderMadeByUs || ours;
+    next.makesFolder = false;
     next.phase = std::max(next.phase, Phase::Sending);
     if (next.way == Way::Station || next.way == Way::Mail)
         next.way = wayOf(by);
     const Result<void> kept = keep(next);
     if (kept) {
-        const DrivePath aside = m_folder.filePath(u".kept"_s);
+        const DrivePath aside = m_folder.keptWorkPath();
         if (m_files.folderExists(aside))
             static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
     }
     return kept;
+}
+
+Result<void> OrderJournal::folderIsAsked() {
+    makeKnown();
+    OrderState next = m_state;
+    next.makesFolder = !next.folderMadeByUs;
+    return keep(next);
+}
+
+Result<void> OrderJournal::folderIsRefused() {
+    makeKnown();
+    OrderState next = m_state;
+    next.makesFolder = false;
+    return keep(next);
 }
 
 Result<void> OrderJournal::take(const QString& path) {
@@ -113,6 +129,16 @@ Result<void> OrderJournal::arrived(bool byNameOnly) {
     OrderState next = m_state;
     next.phase = std::max(next.phase, Phase::Arrived);
     next.provenByNameOnly = byNameOnly;
+    next.filesInHand.clear();
+    next.fewerAgreed = false;
+    return keep(next);
+}
+
+Result<void> OrderJournal::arrivedAsAgreed() {
+    makeKnown();
+    OrderState next = m_state;
+    next.filesInHand.clear();
+    next.fewerAgreed = next.phase < Phase::Arrived;
     return keep(next);
 }
 

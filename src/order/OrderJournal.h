@@ -35,10 +35,18 @@ public:
     // preparation. ours: this order has made it, or it is known to hold nothing of another order. An order that has
     // arrived stays so.
     Result<void> sendingBegins(Sender by, bool ours);
+    // The server is about to be asked to make the folder; it has refused.
+    Result<void> folderIsAsked();
+    Result<void> folderIsRefused();
+    // The customer sends the order again: without a state, it was sent by an older version. Writes nothing by itself.
+    void isSentAgain() { m_sentAgain = true; }
     // A file's full path, before its put and after the put that was confirmed.
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);
+    // All files of the order lie on the server, none is in hand any more.
     Result<void> arrived(bool byNameOnly);
+    // All files of the folder lie there. The log names more, and the customer has agreed to that.
+    Result<void> arrivedAsAgreed();
     // Before report and done call, and after them. A begin that could not be kept has not taken place.
     Result<void> reportBegun();
     Result<void> reportDone();
@@ -55,6 +63,7 @@ private:
     OrderState m_state;
     bool m_known = false;
     bool m_kept = false; // the file holds m_state
+    bool m_sentAgain = false;
 };
 
 } // namespace lumora

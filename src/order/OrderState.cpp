@@ -22,7 +22,7 @@ const QString choicePrefix = u"Choice."_s;
 const QString lastKey = u"End"_s;
 
 DrivePath statePath(const OrderFolder& folder) {
-    return folder.filePath(u".order"_s);
+    return folder.statePath();
 }
 
 // A caption may hold line breaks, and behind a quote a break would end the line.
@@ -83,8 +83,14 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         return takeWord(ways, value, state.way);
     if (key == u"Report")
         return takeWord(reports, value, state.report);
+    if (key == u"MakesFolder")
+        return takeTruth(value, state.makesFolder);
     if (key == u"FolderMadeByUs")
         return takeTruth(value, state.folderMadeByUs);
+    if (key == u"FewerAgreed")
+        return takeTruth(value, state.fewerAgreed);
+    if (key == u"SentBefore")
+        return takeTruth(value, state.sentBefore);
     if (key == u"ProvenByNameOnly")
         return takeTruth(value, state.provenByNameOnly);
     if (key == u"MisparHazmana")
@@ -119,7 +125,13 @@ QByteArray OrderState::write() const {
     writer.text(u"Shemot.ser"_s, serial);
     writer.text(u"Optint"_s, QString::number(static_cast<int>(kind)));
     writer.word("Way", ways, way);
+    if (makesFolder)
+        writer.truth("MakesFolder", true);
     writer.truth("FolderMadeByUs", folderMadeByUs);
+    if (fewerAgreed)
+        writer.truth("FewerAgreed", true);
+    if (sentBefore)
+        writer.truth("SentBefore", true);
     writer.truth("ProvenByNameOnly", provenByNameOnly);
     writer.word("Report", reports, report);
     for (const QString& path : filesInHand)

@@ -19,7 +19,7 @@ struct OrderState {
         Preparing, // prints are being made; the basket and the choices are kept with it
         Prepared,  // complete on the disk, nothing is sent
         Sending,   // its folder on the server was entered; a part may lie there
-        Arrived,   // proven to be on the server
+        Arrived,   // on the server as the sender judges it: proven, or as built in by the count of names
         Reported,  // arrived, and the lab was told or needs no telling
     };
     // The way by which the order is sent. A local station keeps it; the servers do not know an order that went by mail.
@@ -32,7 +32,10 @@ struct OrderState {
     QString serial; // Shemot.ser
     OrderKind kind = OrderKind::NotChosen;
     Way way = Way::Ftp;
+    bool makesFolder = false;      // the server was about to be asked for the folder, and the answer is not known
     bool folderMadeByUs = false;   // this order made its folder on the server
+    bool fewerAgreed = false;      // all files of its folder arrived; the customer agreed that the log names more
+    bool sentBefore = false;       // first known by a resend; an older version has sent it
     bool provenByNameOnly = false; // the server told no lengths
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;

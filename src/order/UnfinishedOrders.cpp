@@ -68,6 +68,8 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
     const OrderState& state = order.state;
     if (state.phase == Phase::Preparing)
         return !state.items.isEmpty();
+    if (state.phase < Phase::Arrived && (state.fewerAgreed || state.sentBefore))
+        return false;
     if (state.phase == Phase::Reported || !canBeSent(session, state) ||
         (state.phase == Phase::Arrived && state.report != OrderState::Report::NotYet))
         return false;
@@ -116,7 +118,7 @@ void tidyOrders(const SessionState& state, const Files& files) {
         if (!FinishedOrderOf(name))
             continue;
         const OrderFolder folder(orders / name);
-        if (const DrivePath fromServer = folder.filePath(u".log-there"_s); files.fileExists(fromServer))
+        if (const DrivePath fromServer = folder.fetchedLogPath(); files.fileExists(fromServer))
             static_cast<void>(files.removeFile(fromServer));
         removeIfEmpty(files, folder.path());
         const Result<OrderState> order = ReadOrderState(files, folder);
@@ -131,7 +133,7 @@ void tidyOrders(const SessionState& state, const Files& files) {
 }
 
 DrivePath KeptWorkFolder(const OrderFolder& folder, const DrivePath& scratch) {
-    return folder.filePath(u".kept"_s) / scratch.leaf();
+    return folder.keptWorkPath() / scratch.leaf();
 }
 
 DrivePath PictureOf(const BasketLine& line, LineForm form, const SessionState& state) {

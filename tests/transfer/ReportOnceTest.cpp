@@ -3,6 +3,7 @@
 #include "order/OrderLog.h"
 #include "support/ExampleOrder.h"
 #include "support/TestPlatform.h"
+#include "transfer/delivery/Attempts.h"
 
 #include <gtest/gtest.h>
 
@@ -42,6 +43,7 @@ struct AReport : ::testing::Test {
     SessionState state = exampleOrder();
     OrderFolder folder{u"C:\\orders\\2026_11_21_KUP_1234^105"_path};
     HeardCalls calls;
+    SendingStop stop;
 };
 
 TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
@@ -95,7 +97,7 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
         OrderJournal journal(test.files, folder);
         calls.heard.clear();
         calls.onOrder = [&] { EXPECT_TRUE(!each.careful || kept().report == Begun) << "begun before the request"; };
-        ReportOnce reports(state, test.files, journal);
+        ReportOnce reports(state, test.files, journal, stop);
         if (each.careful) {
             EXPECT_EQ(reports.isDueWhereFound(each.by), each.told == Told::Now);
         }
@@ -118,7 +120,7 @@ TEST_F(AReport, isNotBegunCarefullyWhereThatCouldNotBeKept) {
         ASSERT_TRUE(journal.arrived(true));
         ASSERT_TRUE(test.files.removeTree(folder.path()));
         calls.heard.clear();
-        ReportOnce reports(state, test.files, journal);
+        ReportOnce reports(state, test.files, journal, stop);
         EXPECT_EQ(reports.tell(Sender::Ftp, calls), careful ? Told::NotKept : Told::Now);
         EXPECT_FALSE(reports.kept());
         EXPECT_EQ(calls.heard.size(), careful ? 0 : 2);
@@ -143,7 +145,7 @@ TEST_F(AReport, tellsAnOrderThatIsSentAgainAsItsLogHasItAndCutsNoValue) {
             OrderJournal journal(test.files, folder);
             ASSERT_TRUE(journal.arrived(true));
             calls.heard.clear();
-            ReportOnce(state, test.files, journal).tellAgain(calls);
+            ReportOnce(state, test.files, journal, stop).tellAgain(calls);
             ASSERT_EQ(calls.heard.size(), 2);
             EXPECT_EQ(calls.heard[1], careful ? u"?t1=lab %26 co&t2=true"_s : u"?t1=lab & co&t2=true"_s);
             const bool fromLog = careful && sending == Sending::Resend;

@@ -4,6 +4,8 @@
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "transfer/report/LabReport.h"
+#include "transfer/report/ReportOnce.h"
 
 #include <QTimer>
 
@@ -16,6 +18,7 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr int whileAPumpRuns = 20; // milliseconds
+constexpr int reportTick = 1000;
 
 } // namespace
 
@@ -26,7 +29,8 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
     , m_platform(platform)
     , m_chain(chain)
     , m_countdown(countdown)
-    , m_shown(shown) {
+    , m_shown(shown)
+    , Timer4Report(reportTick, [this] { watchReport(); }) {
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
         if (page == this)
             QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
@@ -108,6 +112,44 @@ void SendingPage::forgetReason() {
     m_reason.clear();
     m_shown.Label4Reason.text.clear();
     m_shown.Label4Reason.visible = false;
+}
+
+void SendingPage::tellLab() {
+    ReportCalls* calls = reportCalls();
+    if (!calls)
+        return;
+    Timer4Report.start();
+    report().tell(*calls);
+    Timer4Report.stop();
+}
+
+bool SendingPage::mayReportAgain() const {
+    return report().mayTellAgain() && !isUnderWay(m_phase) && m_phase != SendingPhase::Preparing;
+}
+
+bool SendingPage::reportUnknown() const {
+    return report().isEndUnknown();
+}
+
+bool SendingPage::provenByNameOnly() const {
+    return report().provenByNameOnly();
+}
+
+void SendingPage::reportAgain() {
+    ReportCalls* calls = mayReportAgain() ? reportCalls() : nullptr;
+    if (!calls)
+        return;
+    const SendingPhase before = m_phase;
+    stopTimers();
+    enter(SendingPhase::Reporting);
+    Timer4Report.start();
+    report().tellAgain(*calls);
+    Timer4Report.stop();
+    enter(before == SendingPhase::Countdown ? SendingPhase::Waiting : before);
+}
+
+void SendingPage::watchReport() {
+    report().watch();
 }
 
 // The order stays in its folder and is listed among the finished ones.

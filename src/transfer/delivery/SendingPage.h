@@ -1,6 +1,7 @@
 #pragma once
 
 #include "session/Page.h"
+#include "session/Ticker.h"
 #include "transfer/delivery/Countdown.h"
 #include "transfer/delivery/SendingControls.h"
 #include "transfer/delivery/SendingEvents.h"
@@ -10,7 +11,9 @@
 
 namespace lumora {
 
+class LabReport;
 class PageChain;
+class ReportCalls;
 struct Platform;
 struct SessionState;
 
@@ -27,13 +30,20 @@ struct SendingGauge {
 class SendingPage : public Page {
     Q_OBJECT
 public:
-    void Form_Activate() { activate(); } // the page has come to the front
+    void Form_Activate() { activate(); }           // the page has come to the front
+    void Timer4Report_Tick() { watchReport(); }    // each second of a telling
+    void Command4Dooach_Click() { reportAgain(); } // in the operator's area
 
     SendingPhase phase() const { return m_phase; }
     const PhaseLook& look() const;
     SendingGauge gauge() const;
     const Countdown& countdown() const { return m_countdown; }
     const SendingControls& sendingControls() const { return m_shown; }
+
+    // What the operator's area shows of the order. A telling that was begun may have been heard or not.
+    bool reportUnknown() const;
+    bool provenByNameOnly() const;
+    bool mayReportAgain() const;
 
 protected:
     SendingPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain, SendingControls& shown,
@@ -49,6 +59,10 @@ protected:
     virtual void begin() = 0;
     // The customer leaves the page or the program: nothing more may be sent.
     virtual void leave() = 0;
+    virtual void stopTimers() = 0;
+    // How the lab is told; no calls where it can't be.
+    virtual LabReport& report() = 0;
+    virtual ReportCalls* reportCalls() = 0;
 
     void enter(SendingPhase phase);
     // Shows the texts of the phase in the language of the session.
@@ -56,6 +70,7 @@ protected:
     void tellReason(LineStep step, const Failure& failure, const QString& subject);
     void forgetReason();
     const QString& reason() const { return m_reason; } // empty: no failure is to be told
+    void tellLab();
     void leaveForNewOrder();
     void leaveProgram();
 
@@ -70,8 +85,12 @@ protected:
 private:
     void activateWhenFree();
     void activate();
+    void reportAgain();
+    void watchReport();
+    const LabReport& report() const { return const_cast<SendingPage*>(this)->report(); }
 
     SendingControls& m_shown;
+    Ticker Timer4Report; // 1000 ms: the watch over a telling
     SendingPhase m_phase = SendingPhase::Preparing;
     bool m_activated = false;
     QString m_reason; // what the last failure means

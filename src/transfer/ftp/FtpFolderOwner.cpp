@@ -41,7 +41,7 @@ FtpFolderOwner::Owner FtpFolderOwner::byLog(const OrderJournal& order, FtpConnec
     const Result<QByteArray> ours = m_files.read(log);
     if (!ours)
         return Owner::Foreign;
-    const DrivePath fetched = order.folder().filePath(u".log-there"_s);
+    const DrivePath fetched = order.folder().fetchedLogPath();
     const Result<HostPath> target = m_files.host(fetched);
     if (!target)
         return Owner::NotKnown;

@@ -160,7 +160,7 @@ void FtpFrm::sendOrder() {
 }
 
 void FtpFrm::stopSending() {
-    if (phase() != SendingPhase::Sending && phase() != SendingPhase::Checking)
+    if (!isUnderWay(phase()))
         return;
     m_sender.stopNow();
     Command15.enabled = Command21.enabled = false;
@@ -185,11 +185,12 @@ void FtpFrm::succeed() {
     for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
         control->visible = false;
     File1Enabled.enabled = false;
-    Command15.enabled = false;
     status(wording(u" מיד מסיימים ", u" Finishing at once "));
     captionFollowsStatus();
     m_platform.pump.pump();
     tellLab();
+    if (m_sender.stop.left)
+        return;
     forgetReason();
     status(wording(u"הקבצים הועלו בהצלחה", u"The files were uploaded successfully"));
     captionFollowsStatus();
@@ -203,9 +204,11 @@ void FtpFrm::succeed() {
 }
 
 void FtpFrm::finish(SendingPhase end) {
-    keepArrival(end);
+    m_sender.report.keepArrival(m_sender.arrival(end), end, m_sender.provenByNameOnly());
     if (end == SendingPhase::Success)
         succeed();
+    if (m_sender.stop.left)
+        return;
     pageSize = PageSize::Full;
     Label4File.text.clear();
     Label34.visible = !hasArrived(end); // after success the number of attempts is of no interest
@@ -228,7 +231,7 @@ void FtpFrm::leave() {
 }
 
 void FtpFrm::close() {
-    if (hasArrived(phase())) {
+    if (hasArrived(phase()) || phase() == SendingPhase::Reporting) {
         leaveProgram();
         return;
     }

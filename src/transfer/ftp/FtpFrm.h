@@ -92,7 +92,9 @@ private:
     void holdOrGoOn();
     void holdCount();
     void startCount();
-    void stopTimers();
+    void stopTimers() override;
+    LabReport& report() override { return m_sender.report; }
+    ReportCalls* reportCalls() override;
     void showSeconds();
     void showSecondsAfterFailure();
     void sendOrder();
@@ -116,9 +118,7 @@ private:
     bool mayBeSent();    // what List3 names makes an order
     void prepareAgain(); // the order's number is another order's on the server
     void tellForeign();
-    void keepArrival(SendingPhase end); // in the order's state
-    void tellLab();                     // report and done call
-    void watchLine();                   // each second of a sending
+    void watchLine(); // each second of a sending
 
     // FtpFrmTexts.cpp
     std::span<const PhaseLook> looks() const override;

@@ -57,22 +57,8 @@ void FtpFrm::watchLine() {
     m_sender.pass.watch();
 }
 
-void FtpFrm::keepArrival(SendingPhase end) {
-    OrderJournal* journal = m_sender.session.journal();
-    if (!journal || !m_sender.orderArrived(end))
-        return;
-    m_sender.session.keep(journal->arrived(m_sender.provenByNameOnly()));
-    if (end == SendingPhase::AllThere)
-        m_sender.session.keep(journal->needsNoReport());
-}
-
-void FtpFrm::tellLab() {
-    OrderJournal* journal = m_sender.session.journal();
-    if (!journal || !m_chain.isRegistered(PageId::InetForm))
-        return;
-    ReportOnce reports(m_state, m_platform.files, *journal);
-    reports.tell(Sender::Ftp, m_chain.load<InetForm>());
-    m_sender.session.keep(reports.kept());
+ReportCalls* FtpFrm::reportCalls() {
+    return m_chain.isRegistered(PageId::InetForm) ? &m_chain.load<InetForm>() : nullptr;
 }
 
 } // namespace lumora

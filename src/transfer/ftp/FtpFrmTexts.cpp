@@ -105,7 +105,7 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     using enum SendingButton;
     const bool underWay = isUnderWay(row.phase);
     const bool ended = row.main == SendAgain || row.phase == SendingPhase::CallLab;
-    Command15.enabled = Command21.enabled = underWay && row.phase != SendingPhase::Reporting;
+    Command15.enabled = Command21.enabled = underWay;
     Command15.visible = row.buttons.testFlag(Stop);
     Image5.visible = row.buttons.testFlag(SendNow);
     Command23.visible = row.buttons.testAnyFlags(SendingButtons(Hold) | GoOn);

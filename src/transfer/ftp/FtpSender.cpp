@@ -122,6 +122,7 @@ FtpSender::FtpSender(SessionState& state, const Platform& platform, SendingEvent
     : session(state, platform, events, stop, lists)
     , pass(state, platform, events, stop, lists, session)
     , check(state.transfer, platform, events, stop, lists, session)
+    , report(state, platform, stop, Sender::Ftp, [this](const Result<void>& written) { session.keep(written); })
     , m_platform(platform)
     , m_events(events) {}
 
@@ -140,11 +141,13 @@ void FtpSender::clearLists() {
         list->clear();
     NumToSend = 0;
     check.NumOnServer = 0;
+    report.beginOrder(nullptr);
 }
 
 void FtpSender::beginOrder() {
     NumToSend = countList3();
     session.beginOrder();
+    report.beginOrder(session.journal());
     lists.List4Makor.clear();
     lists.List4Makor.append(lists.List3.items());
     takeBroken();
@@ -204,12 +207,16 @@ bool FtpSender::lacksFiles() const {
                                    : check.NumOnServer < NumToSend;
 }
 
-bool FtpSender::orderArrived(SendingPhase end) const {
-    return end == SendingPhase::Success || (end == SendingPhase::AllThere && !session.provesArrival());
+Arrival FtpSender::arrival(SendingPhase end) const {
+    if (!hasArrived(end))
+        return Arrival::Part;
+    if (session.provesArrival())
+        return check.proven;
+    return check.restOfOrder().isEmpty() ? Arrival::Whole : Arrival::Part;
 }
 
 SendingPhase FtpSender::arrivedEnd() const {
-    return check.orderProven || !session.provesArrival() ? SendingPhase::Success : SendingPhase::AllThere;
+    return check.proven == Arrival::Whole || !session.provesArrival() ? SendingPhase::Success : SendingPhase::AllThere;
 }
 
 SendingPhase FtpSender::changedEnd() {

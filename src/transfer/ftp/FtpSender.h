@@ -2,6 +2,7 @@
 
 #include "transfer/ftp/UploadCheck.h"
 #include "transfer/ftp/UploadPass.h"
+#include "transfer/report/LabReport.h"
 
 namespace lumora {
 
@@ -40,8 +41,8 @@ public:
         ServerChanges, // what is there has other line ends
     };
     Verdict verdict() const;
-    // True when this end means that the whole order has arrived.
-    bool orderArrived(SendingPhase end) const;
+    // What has arrived where the sending ends so.
+    Arrival arrival(SendingPhase end) const;
     bool provenByNameOnly() const { return !check.proof || check.proof->provenByNameOnly(); }
     // The end when nothing is left to send but the counts differ.
     SendingPhase silentEnd() const;
@@ -53,6 +54,7 @@ public:
     FtpSession session;
     UploadPass pass;
     UploadCheck check;
+    LabReport report;
     std::int16_t NumToSend = 0; // number of files that make up the order
 
 private:

@@ -53,6 +53,8 @@ void FtpSession::beginOrder() {
     m_arrival.beginOrder();
     m_inFolder.clear();
     m_journal.emplace(m_platform.files, OrderFolder(m_transfer.OrderFolder));
+    if (m_transfer.SugMishloah == Sending::Resend)
+        m_journal->isSentAgain();
 }
 
 void FtpSession::beginPass() {

@@ -114,7 +114,7 @@ void UploadCheck::ListServerFiles() {
     freshCount = false;
     unreadable = false;
     proof.reset();
-    orderProven = false;
+    proven = Arrival::Part;
     freshConnection();
     if (m_stop.left)
         return;
@@ -137,27 +137,42 @@ void UploadCheck::ListServerFiles() {
 // Before the connection leaves the folder.
 void UploadCheck::prove() {
     proof = m_session.prove(m_lists.List4Makor.items());
-    orderProven = proof && missing().isEmpty() && wholeOrderThere();
+    if (proof && missing().isEmpty())
+        proven = orderThere();
 }
 
-bool UploadCheck::wholeOrderThere() {
+QStringList UploadCheck::restOfOrder() const {
     const OrderFolder order(m_transfer.OrderFolder);
     const QStringList entries = m_files.names(order.path(), u"*.gbr;*.jpp;*.prk"_s);
     QStringList rest = FtpOrderFiles(m_files, order, entries, m_transfer.Mefurak == Travel::Pieces);
     rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
+    return rest;
+}
+
+Arrival UploadCheck::orderThere() {
+    const OrderFolder order(m_transfer.OrderFolder);
+    const QStringList rest = restOfOrder();
     // What an earlier sending has not confirmed may lie there by half.
     const QStringList unconfirmed = m_session.journal()->state().filesInHand + ReadBrokenFiles(m_files, order);
     if (std::any_of(rest.begin(), rest.end(), [&](const QString& path) { return unconfirmed.contains(path); }))
-        return false;
+        return Arrival::Part;
     const std::optional<ArrivalProof> ofRest = m_session.prove(rest);
     if (!ofRest || !ofRest->proven())
-        return false;
+        return Arrival::Part;
     OrderLog log;
     if (const Result<QByteArray> bytes = m_files.read(order.logPath()))
         log.read(*bytes);
     const QStringList there = m_lists.List6.items();
-    const auto verdict = OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict();
-    return verdict == OrderCompleteness::Verdict::Whole || verdict == OrderCompleteness::Verdict::Unknown;
+    switch (OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict()) {
+    case OrderCompleteness::Verdict::Whole:
+    case OrderCompleteness::Verdict::Unknown:
+        return Arrival::Whole;
+    case OrderCompleteness::Verdict::Fewer:
+        return Arrival::Agreed;
+    case OrderCompleteness::Verdict::None:
+        break;
+    }
+    return Arrival::Part;
 }
 
 void UploadCheck::RecheckBroken() {

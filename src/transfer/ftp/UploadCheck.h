@@ -2,6 +2,7 @@
 
 #include "platform/Platform.h"
 #include "transfer/ftp/FtpSession.h"
+#include "transfer/report/LabReport.h"
 
 namespace lumora {
 
@@ -35,8 +36,10 @@ public:
     // What the last ListServerFiles proves of the files of the sending; none as built in, and where it has not read the
     // order's folder whole.
     std::optional<ArrivalProof> proof;
-    // With the proof: the whole order lies there, also where the sending is only a part of it.
-    bool orderProven = false;
+    // With the proof: how much of the order lies there, also where the sending is only a part of it.
+    Arrival proven = Arrival::Part;
+    // Full paths of the order's files that are not among those of the sending.
+    QStringList restOfOrder() const;
 
     // Files of the order that are not on the server, or there only as the remains of a failed put; by the proof, where
     // there is one.
@@ -50,7 +53,7 @@ public:
 private:
     bool lookUp();
     void prove();
-    bool wholeOrderThere();
+    Arrival orderThere();
     bool isThere(const QString& name) const;
     void filterDots();
     void count();

@@ -28,6 +28,7 @@ const QString testFolder = u"tttt"_s;
 
 HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEvents& events)
     : Attempts(events, stop)
+    , report(state, platform, stop, Sender::Http, [this](const Result<void>& written) { keep(written); })
     , m_state(state)
     , m_platform(platform)
     , m_script(platform)
@@ -56,6 +57,9 @@ void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.clear();
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
     m_journal.emplace(m_platform.files, OrderFolder(m_state.transfer.OrderFolder));
+    if (m_state.transfer.SugMishloah == Sending::Resend)
+        m_journal->isSentAgain();
+    report.beginOrder(&*m_journal);
     m_notKeptTold = false;
     m_arrival.beginOrder();
     takeLeftBehind();
@@ -263,30 +267,15 @@ bool HttpSender::isWholeOrder() const {
     return m_arrival.isWholeOrder(OrderFolder(m_state.transfer.OrderFolder), names);
 }
 
-void HttpSender::keepArrival() {
-    if (!m_journal)
-        return;
-    const QStringList inHand = m_journal->state().filesInHand;
-    for (const QString& path : inHand)
-        keep(m_journal->release(path));
-    keep(m_journal->arrived(m_arrival.byNameOnly()));
-}
-
-void HttpSender::tellLab() {
-    if (!m_journal)
-        return;
-    ReportOnce reports(m_state, m_platform.files, *m_journal);
-    reports.tell(Sender::Http, *this);
-    keep(reports.kept());
+void HttpSender::keepArrival(SendingPhase end) {
+    report.keepArrival(isWholeOrder() ? Arrival::Whole : Arrival::Agreed, end, m_arrival.byNameOnly());
 }
 
 bool HttpSender::keepFoundThere() {
-    if (!m_journal || !isWholeOrder())
-        return false;
-    keepArrival();
-    ReportOnce reports(m_state, m_platform.files, *m_journal);
-    const bool due = reports.isDueWhereFound(Sender::Http);
-    keep(reports.kept());
+    keepArrival(SendingPhase::Success);
+    const bool due = isWholeOrder() && report.isDueWhereFound();
+    if (!due)
+        keepArrival(SendingPhase::AllThere);
     return due;
 }
 

@@ -7,6 +7,7 @@
 #include "transfer/http/HttpListGuard.h"
 #include "transfer/http/ServerList.h"
 #include "transfer/http/UploadScript.h"
+#include "transfer/report/LabReport.h"
 #include "transfer/report/ReportOnce.h"
 
 #include <optional>
@@ -37,7 +38,7 @@ struct HttpLists {
 
 // Sends one order by HTTP, file by file, and asks scripts on the lab's web server which files have arrived. Only the
 // server's list tells success, never the answer to an upload.
-class HttpSender final : private Attempts, private ReportCalls {
+class HttpSender final : private Attempts, public ReportCalls {
 public:
     static constexpr int attempts = 3;
 
@@ -58,14 +59,12 @@ public:
     // Up to three attempts. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> HttpAttempts();
 
-    // The order lies on the server: keeps that, and tells the lab where it is to be told.
-    void keepArrival();
-    void tellLab();
+    // The sending has ended so: keeps what has arrived.
+    void keepArrival(SendingPhase end);
     // The files of the folder lay on the server before anything was sent. True when the lab has yet to be told of the
     // order.
     bool keepFoundThere();
 
-    // The answers of both calls are ignored.
     void HttpSendReport(const QString& query) const;
     void HttpSendDone(const QString& query) const;
     void HttpPause(int times = 1);
@@ -75,16 +74,18 @@ public:
     void postNothing();
     void fetchTestListing();
 
+    // The answers of report and done call are ignored.
+    void reportOrder(const QString& query) override;
+    void reportDone(const QString& query) override { HttpSendDone(query); }
+
     HttpLists lists;
     SendingStop stop;
+    LabReport report;
 
 private:
     std::optional<SendingPhase> sendMissing(int attempt) override;
     std::optional<SendingPhase> checkArrival(int attempt) override;
     SendingPhase afterTheLast() override { return SendingPhase::NotAll; }
-
-    void reportOrder(const QString& query) override;
-    void reportDone(const QString& query) override { HttpSendDone(query); }
 
     bool isWholeOrder() const;
     void takeLeftBehind();

@@ -184,6 +184,7 @@ void UploadForm::sendMissing() {
         return;
     }
     if (*end == SendingPhase::AllThere) {
+        m_sender.keepArrival(*end);
         endAllThere();
         return;
     }
@@ -210,10 +211,10 @@ void UploadForm::succeed() {
     m_attemptFailed = false;
     forgetReason();
     enter(SendingPhase::Reporting);
-    m_sender.keepArrival();
+    m_sender.keepArrival(SendingPhase::Success);
     m_sender.HttpPause(2);
     if (!m_sender.stop.left)
-        m_sender.tellLab();
+        tellLab();
     if (m_sender.stop.left)
         return;
     Label9.visible = Pic4Hamten.visible = Picture1.visible = false;

@@ -96,7 +96,9 @@ private:
     bool idle() const;
     void growPanel();
     void countSecond();
-    void stopTimers();
+    void stopTimers() override;
+    LabReport& report() override { return m_sender.report; }
+    ReportCalls* reportCalls() override { return &m_sender; }
     void startPanel();
     void refreshList();
     void findMissing();

@@ -27,20 +27,23 @@ QString InetForm::FetchUrlSmall(const QString& url) {
     return body ? AnsiCodePage::decode(*body) : QString();
 }
 
-QString InetForm::orderQuery() const {
-    return OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
+void InetForm::report() {
+    announceReport();
+    reportOrder(OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot));
 }
 
 QString InetForm::doneQuery() const {
     return DoneQuery(m_state.profile, m_state.transfer);
 }
 
-void InetForm::reportOrder(const QString& query) {
+// The lab's site expects a call of this address before each report.
+void InetForm::announceReport() {
     m_platform.pump.pump();
-    const QString& script = m_state.profile.ReportUrl;
-    // The lab's site expects a call of this address before each report.
-    TeshuvatSharat = FetchUrlSmall(script + u"c.txt"_s);
-    TeshuvatSharat = FetchUrlSmall(script + query);
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.ReportUrl + u"c.txt"_s);
+}
+
+void InetForm::reportOrder(const QString& query) {
+    TeshuvatSharat = FetchUrlSmall(m_state.profile.ReportUrl + query);
     Q_EMIT changed();
 }
 

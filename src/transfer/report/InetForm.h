@@ -22,9 +22,10 @@ public:
     InetForm(const SessionState& state, const Platform& platform, PageChain& chain);
 
     // Events.
-    void Command1_Click() { reportOrder(orderQuery()); }
+    void Command1_Click() { report(); }
     void Command2_Click() { reportDone(doneQuery()); }
 
+    void announceReport() override;
     void reportOrder(const QString& query) override;
     void reportDone(const QString& query) override;
 
@@ -35,7 +36,7 @@ public:
     QString FetchUrlSmall(const QString& url);
 
 private:
-    QString orderQuery() const;
+    void report();
     QString doneQuery() const;
 
     const SessionState& m_state;

@@ -3,6 +3,7 @@
 #include "order/OrderDetailsReader.h"
 #include "order/OrderJournal.h"
 #include "order/OrderReport.h"
+#include "transfer/delivery/Attempts.h"
 
 namespace lumora {
 
@@ -39,19 +40,21 @@ ReportOnce::Told ReportOnce::tell(Sender by, ReportCalls& calls) {
     m_kept = {};
     if (const std::optional<Told> before = toldOrUnwanted())
         return *before;
-    if (!isWanted(by)) {
+    if (isWanted(by))
+        return request(calls);
+    if (m_journal.state().phase >= Phase::Arrived)
         keep(m_journal.needsNoReport());
-        return Told::NotWanted;
-    }
-    return request(calls);
+    return Told::NotWanted;
 }
 
-bool ReportOnce::isDueWhereFound(Sender by) {
+bool ReportOnce::isDueWhereFound(Sender by) const {
+    return m_state.Careful && !toldOrUnwanted() && isWanted(by);
+}
+
+void ReportOnce::endsUntold() {
     m_kept = {};
-    if (m_state.Careful)
-        return !toldOrUnwanted() && isWanted(by);
-    keep(m_journal.needsNoReport());
-    return false;
+    if (!m_state.Careful)
+        keep(m_journal.needsNoReport());
 }
 
 ReportOnce::Told ReportOnce::tellAgain(ReportCalls& calls) {
@@ -60,22 +63,38 @@ ReportOnce::Told ReportOnce::tellAgain(ReportCalls& calls) {
 }
 
 ReportOnce::Told ReportOnce::request(ReportCalls& calls) {
-    if (!keep(m_journal.reportBegun()) && m_state.Careful)
+    const bool ofAnArrival = m_journal.state().phase >= Phase::Arrived || m_journal.state().report != Report::NotYet;
+    if (ofAnArrival && !keep(m_journal.reportBegun()) && m_state.Careful)
         return Told::NotKept;
-    calls.reportOrder(orderQuery());
-    calls.reportDone(
-        DoneQuery(m_state.profile, m_state.transfer, m_state.Careful ? ReportForm::Encoded : ReportForm::AsItStands));
-    keep(m_journal.reportDone());
+    if (!makeCalls(calls))
+        return Told::Cut;
+    if (ofAnArrival)
+        keep(m_journal.reportDone());
     return Told::Now;
 }
 
-QString ReportOnce::orderQuery() const {
-    if (!m_state.Careful)
-        return OrderReportQuery(m_state.profile, m_state.transfer, m_state.shemot);
+bool ReportOnce::isStopped() const {
+    return m_stop.StopFlag || m_stop.left;
+}
+
+// False where the last call may not have come through, or was not made at all.
+bool ReportOnce::makeCalls(ReportCalls& calls) const {
+    const ReportForm form = m_state.Careful ? ReportForm::Encoded : ReportForm::AsItStands;
+    const QString order = OrderReportQuery(m_state.profile, m_state.transfer, details(), form);
+    if (!isStopped())
+        calls.announceReport();
+    if (!isStopped())
+        calls.reportOrder(order);
+    if (!isStopped())
+        calls.reportDone(DoneQuery(m_state.profile, m_state.transfer, form));
+    return !isStopped();
+}
+
+OrderDetails ReportOnce::details() const {
     OrderDetails details = m_state.shemot;
-    if (m_state.transfer.SugMishloah == Sending::Resend)
+    if (m_state.Careful && m_state.transfer.SugMishloah == Sending::Resend)
         ReadReportDetails(m_files, m_journal.folder().logPath(), details);
-    return OrderReportQuery(m_state.profile, m_state.transfer, details, ReportForm::Encoded);
+    return details;
 }
 
 } // namespace lumora

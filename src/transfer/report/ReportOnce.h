@@ -11,11 +11,13 @@ namespace lumora {
 
 class Files;
 class OrderJournal;
+struct SendingStop;
 
-// The two requests that tell the lab's site of an order, as one of the senders makes them. Their answers are not looked
-// at.
+// The requests that tell the lab's site of an order, as one of the senders makes them. Their answers are not looked at.
 class ReportCalls {
 public:
+    // Before the report.
+    virtual void announceReport() {}
     virtual void reportOrder(const QString& query) = 0;
     virtual void reportDone(const QString& query) = 0;
 
@@ -26,15 +28,14 @@ protected:
 // Tells the lab of an order: the order report, then the done call. As built in, each arrival by FTP is told where
 // ReportOn is above 0, and a new order's by HTTP. Careful: at most once for an order, by whichever sender it has
 // arrived; an order that is sent again is told as its log has it, and signs that cut a query are encoded.
-//
-// A sending page calls tell() after OrderJournal::arrived() with the journal of its order, and shows a failure of
-// kept(): a step of the telling that could not be written to the order's folder.
+// The state of an order that has not arrived, as that of a chosen part, is left as it is.
 class ReportOnce {
 public:
-    ReportOnce(const SessionState& state, const Files& files, OrderJournal& journal)
+    ReportOnce(const SessionState& state, const Files& files, OrderJournal& journal, const SendingStop& stop)
         : m_state(state)
         , m_files(files)
-        , m_journal(journal) {}
+        , m_journal(journal)
+        , m_stop(stop) {}
 
     enum class Told {
         Now,
@@ -42,6 +43,7 @@ public:
         NotKnown,  // an earlier telling was begun, and its end is not known
         NotWanted, // the lab wants no report of this order, or not all of it has arrived
         NotKept,   // the begin could not be kept, so that no request went out
+        Cut,       // stopped or left in between: begun, and its end is not known
     };
     Told tell(Sender by, ReportCalls& calls);
     // Whatever was told before, for an operator who knows that the lab has heard nothing.
@@ -49,21 +51,26 @@ public:
 
     // For an order that lay whole on the server before anything was sent: true where tell() would tell of it now. As
     // built in, such an order is never told of.
-    bool isDueWhereFound(Sender by);
+    bool isDueWhereFound(Sender by) const;
+    // The order has arrived and ends untold; as built in, nothing is left to tell of it then.
+    void endsUntold();
 
-    // Of the last call.
+    // Of the last call: fails where a step of the telling could not be written to the order's folder.
     const Result<void>& kept() const { return m_kept; }
 
 private:
     std::optional<Told> toldOrUnwanted() const;
     bool isWanted(Sender by) const;
+    bool isStopped() const;
     Told request(ReportCalls& calls);
-    QString orderQuery() const;
+    bool makeCalls(ReportCalls& calls) const;
+    OrderDetails details() const;
     bool keep(const Result<void>& written);
 
     const SessionState& m_state;
     const Files& m_files;
     OrderJournal& m_journal;
+    const SendingStop& m_stop;
     Result<void> m_kept;
 };
 

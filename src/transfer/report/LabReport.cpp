@@ -1,0 +1,96 @@
+#include "transfer/report/LabReport.h"
+
+#include "order/OrderJournal.h"
+#include "platform/Platform.h"
+#include "platform/line/Internet.h"
+#include "transfer/delivery/Attempts.h"
+#include "transfer/delivery/StoppableLine.h"
+#include "transfer/report/ReportOnce.h"
+
+#include <utility>
+
+namespace lumora {
+
+using Phase = OrderState::Phase;
+using Report = OrderState::Report;
+
+namespace {
+
+constexpr int longestTelling = 120; // seconds
+
+} // namespace
+
+LabReport::LabReport(const SessionState& state, const Platform& platform, SendingStop& stop, Sender by, Keep keep)
+    : m_state(state)
+    , m_platform(platform)
+    , m_stop(stop)
+    , m_by(by)
+    , m_keep(std::move(keep)) {}
+
+void LabReport::keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly) {
+    if (!m_order || !hasArrived(end))
+        return;
+    if (arrival == Arrival::Agreed)
+        m_keep(m_order->arrivedAsAgreed());
+    if (arrival != Arrival::Whole)
+        return;
+    m_keep(m_order->arrived(byNameOnly));
+    if (end != SendingPhase::AllThere)
+        return;
+    ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
+    reports.endsUntold();
+    m_keep(reports.kept());
+}
+
+bool LabReport::isDueWhereFound() const {
+    return m_order && ReportOnce(m_state, m_platform.files, *m_order, m_stop).isDueWhereFound(m_by);
+}
+
+bool LabReport::isLeft() const {
+    return m_order && m_order->state().phase == Phase::Arrived && m_order->state().report == Report::NotYet;
+}
+
+void LabReport::tell(ReportCalls& calls) {
+    run([&](ReportOnce& reports) { reports.tell(m_by, calls); });
+}
+
+void LabReport::tellAgain(ReportCalls& calls) {
+    run([&](ReportOnce& reports) { reports.tellAgain(calls); });
+}
+
+void LabReport::run(const std::function<void(ReportOnce&)>& telling) {
+    if (!m_order || m_seconds)
+        return;
+    m_stop.StopFlag = false;
+    m_seconds = 0;
+    ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
+    {
+        const StoppableLine line(m_platform);
+        telling(reports);
+    }
+    m_keep(reports.kept());
+    m_seconds.reset();
+    m_stop.StopFlag = false;
+}
+
+// By the way of a stop.
+void LabReport::watch() {
+    if (!m_seconds || ++*m_seconds < longestTelling)
+        return;
+    m_stop.StopFlag = true;
+    m_platform.internet.abort();
+}
+
+bool LabReport::mayTellAgain() const {
+    return m_order && m_order->state().report != Report::NotYet;
+}
+
+bool LabReport::isEndUnknown() const {
+    return m_order && m_order->state().report == Report::Begun;
+}
+
+bool LabReport::provenByNameOnly() const {
+    return m_state.Careful && m_order && m_order->state().phase >= Phase::Arrived && m_order->state().provenByNameOnly;
+}
+
+} // namespace lumora

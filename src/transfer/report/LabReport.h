@@ -1,0 +1,68 @@
+#pragma once
+
+#include "session/SessionState.h"
+#include "transfer/delivery/SendingPhase.h"
+
+#include <functional>
+#include <optional>
+
+namespace lumora {
+
+class OrderJournal;
+class ReportCalls;
+class ReportOnce;
+struct Platform;
+struct SendingStop;
+
+// How much of an order its sending has brought to the server.
+enum class Arrival {
+    Whole,  // all that belongs to it
+    Agreed, // all files of its folder; the customer has agreed that its log names more pictures
+    Part,   // less, as a chosen part
+};
+
+// What follows an arrival, for both senders: it is kept in the order's state, then the lab is told of it. A telling
+// ends at the latest after two minutes, and within a second where it is stopped; it then counts as begun.
+class LabReport {
+public:
+    // keep: takes each step's write.
+    using Keep = std::function<void(const Result<void>&)>;
+    LabReport(const SessionState& state, const Platform& platform, SendingStop& stop, Sender by, Keep keep);
+
+    // order: the state of the order that is sent from now on, none where there is none to tell of.
+    void beginOrder(OrderJournal* order) { m_order = order; }
+
+    // The sending ends so, and so much has arrived.
+    void keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly);
+    // For an order that lay whole on the server before anything was sent, behind keepArrival(): true where the lab has
+    // yet to be told of it.
+    bool isDueWhereFound() const;
+    // The order has arrived, and only the lab was not told of it yet.
+    bool isLeft() const;
+
+    void tell(ReportCalls& calls);
+    // For an operator, whatever was told before.
+    void tellAgain(ReportCalls& calls);
+    // Each second of a telling: cuts one that takes too long.
+    void watch();
+
+    // A telling was begun, now or earlier.
+    bool mayTellAgain() const;
+    // A telling was begun, and it is not known whether the lab has heard it.
+    bool isEndUnknown() const;
+    // The order has arrived, and the server told no lengths to prove it by. As built in none are asked for.
+    bool provenByNameOnly() const;
+
+private:
+    void run(const std::function<void(ReportOnce&)>& telling);
+
+    const SessionState& m_state;
+    const Platform& m_platform;
+    SendingStop& m_stop;
+    Sender m_by;
+    Keep m_keep;
+    OrderJournal* m_order = nullptr;
+    std::optional<int> m_seconds; // of the telling that is under way
+};
+
+} // namespace lumora
