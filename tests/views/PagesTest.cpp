@@ -38,6 +38,8 @@ TEST_P(PageLook, FromTheStartToTheTerms) {
     look(walk, u"08-border"_s);
     walk.toTerms();
     look(walk, u"09-terms"_s);
+    pressAndLook(walk, u"nnn"_s, u"Command3"_s, u"09-terms-not-agreed"_s);
+    walk.program().dialogs().closeMessages();
 }
 
 TEST_P(PageLook, FromThePicturesToTheSending) {

@@ -103,6 +103,8 @@ QString clippedText(const QWidget& widget) {
     if (const auto* label = qobject_cast<const QLabel*>(&widget)) {
         if (label->text().isEmpty() || !label->pixmap().isNull())
             return {};
+        if (label->layoutDirection() == Qt::RightToLeft && label->text().contains(u" \n"_s))
+            return u"a line of \"%1\" ends with a blank, which pushes it out of its label"_s.arg(label->text());
         const QSize needed =
             label->wordWrap()
                 ? QSize(label->fontMetrics()

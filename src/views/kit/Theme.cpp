@@ -185,6 +185,9 @@ QString isolated(const QString& text) {
         "|\\d+(?:\\s*[/x,_-]\\s*\\d+|[:.]\\d+)+(?:\\s?%)?|\\d+\\s?%|\\+\\d+"_s);
     QString result = text;
     result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
+    // Qt draws a right-to-left line that ends with a blank that much too far to the right, and the label cuts it.
+    static const QRegularExpression blanksAtLineEnd(u" +(?=\n|$)"_s);
+    result.remove(blanksAtLineEnd);
     qsizetype shift = 0;
     for (auto it = ownDirection.globalMatch(result); it.hasNext();) {
         const auto match = it.next();

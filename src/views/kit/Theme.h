@@ -93,8 +93,8 @@ private:
     mutable std::map<std::pair<QString, std::pair<int, QRgb>>, QPixmap> m_icons;
 };
 
-// A line of text with the places that must keep their own direction (sizes, paths, addresses, "3 / 12") set apart, so
-// that a sentence in Hebrew does not turn them over.
+// A text as labels show it: lines end in no blank, and the places that must keep their own direction (sizes, paths,
+// addresses, "3 / 12") are set apart, so that a sentence in Hebrew does not turn them over.
 QString isolated(const QString& text);
 // Names and paths run from left to right in a Hebrew line too.
 QString fromLeft(const QString& text);
