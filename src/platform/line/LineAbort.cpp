@@ -15,7 +15,7 @@ void LineAbort::abort() {
         // Linux resets a connection that is given no peer; a shutdown alone would end the data in good order. The
         // shutdown wakes who waits where nothing is connected yet.
         const sockaddr nobody{AF_UNSPEC, {}};
-        ::connect(descriptor, &nobody, sizeof(nobody));
+        static_cast<void>(::connect(descriptor, &nobody, sizeof(nobody)));
         ::shutdown(descriptor, SHUT_RDWR);
     }
 }
