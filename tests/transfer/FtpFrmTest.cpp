@@ -105,23 +105,6 @@ TEST_F(FtpFrmTest, SendsAfterTheFifteenthSecondAndOnlyOnce) {
     EXPECT_EQ(lab.urls.size(), 3);
 }
 
-TEST_F(FtpFrmTest, IgnoresStartControlsWhileFilesTravel) {
-    bool pressed = false;
-    lab.onPut = [&](const QString&) {
-        FtpFrm& page = rig.page();
-        EXPECT_TRUE(isUnderWay(page.phase()));
-        for (auto start : {&FtpFrm::Command12_Click, &FtpFrm::Command10_Click, &FtpFrm::Image5_Click,
-                           &FtpFrm::Command13_Click, &FtpFrm::Command1_Click, &FtpFrm::Command4_Click,
-                           &FtpFrm::Command19_Click, &FtpFrm::Command28_Click, &FtpFrm::Command23_Click})
-            (page.*start)();
-        pressed = true;
-    };
-    rig.send();
-    EXPECT_TRUE(pressed);
-    EXPECT_EQ(lab.puts, FtpFrmRig::names());
-    EXPECT_EQ(rig.page().AllDone(), 1);
-}
-
 // The window's own close knows nothing of the pass that runs below it.
 TEST(FtpFrm, EndsAtOnceWhenProgramOrPageGoInTheMiddle) {
     const std::function<void(FtpFrmRig&)> ways[] = {[](FtpFrmRig& order) { order.page().Command16_Click(); },
@@ -139,21 +122,6 @@ TEST(FtpFrm, EndsAtOnceWhenProgramOrPageGoInTheMiddle) {
         EXPECT_TRUE(line.lab.urls.isEmpty());
         EXPECT_TRUE(line.rig.test.dialogs.messages.isEmpty());
     }
-}
-
-// The second half of a double press falls on the page that has just come up.
-TEST_F(FtpFrmTest, IgnoresAStartBeforeTheOrderIsListed) {
-    rig.test.pump.onPump = [&] {
-        if (auto* page = static_cast<FtpFrm*>(rig.chain.find(PageId::FtpFrm));
-            page && page->lists().List4Makor.isEmpty()) {
-            page->Image5_Click();
-            page->Command10_Click();
-        }
-    };
-    rig.start();
-    EXPECT_TRUE(rig.page().counting());
-    EXPECT_TRUE(rig.test.dialogs.messages.isEmpty());
-    EXPECT_TRUE(lab.puts.isEmpty());
 }
 
 TEST_F(FtpFrmTest, TakesTheLinesOfAResendAndForgetsTheCustomerBefore) {
@@ -256,15 +224,6 @@ TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {
     EXPECT_TRUE(lab.urls.at(1).endsWith(u"padd.asp"_s));
 }
 
-TEST_F(FtpFrmTest, TheOlderBulkPathSendsNothingWhereNoListWasHandedOver) {
-    FtpFrm& page = rig.start();
-    const QStringList order = page.lists().List3.items();
-    page.Command2_Click();
-    EXPECT_EQ(rig.test.dialogs.messages, QStringList(u"list3 is empty"_s));
-    EXPECT_EQ(page.lists().List3.items(), order);
-    EXPECT_EQ(lab.urls.size(), 0) << "no report of an order that did not go";
-}
-
 TEST_F(FtpFrmTest, ShowsWhatTheOrderAndTheLabCallFor) {
     FtpFrmRig home(lab);
     home.state.KodMishloach = u"HOM"_s;
@@ -277,30 +236,6 @@ TEST_F(FtpFrmTest, ShowsWhatTheOrderAndTheLabCallFor) {
         EXPECT_EQ(page.controls().Label15.visible, each == &home) << "the delivery note";
     }
     EXPECT_EQ(home.page().controls().Label4Ktovet.text, u"Herzl 1"_s);
-
-    FtpFrmRig noServer(lab);
-    noServer.state.profile.FtpPassword.clear();
-    EXPECT_FALSE(noServer.start().counting());
-    EXPECT_EQ(noServer.test.dialogs.messages.size(), 2);
-    FtpFrmRig noOrder(lab);
-    noOrder.state.transfer.OrderFolder = u"***"_path;
-    EXPECT_FALSE(noOrder.start().counting());
-    EXPECT_TRUE(noOrder.page().lists().List3.isEmpty());
-}
-
-TEST_F(FtpFrmTest, TheManualPanelPutsGetsAndDeletes) {
-    FtpFrm& page = rig.start();
-    page.Command3_Click();
-    EXPECT_EQ(rig.test.dialogs.messages.last(), u"Not in session"_s);
-    page.cmdInternetOpen_Click();
-    page.File1_Click(page.files().names().indexOf(FtpFrmRig::first()));
-    page.Command3_Click();
-    page.List2_Click(page.lists().List2.find(FtpFrmRig::first()));
-    rig.write(FtpFrmRig::first(), "lost");
-    page.Command5_Click();
-    EXPECT_GT(rig.localFiles().at(FtpFrmRig::first()).size(), 100);
-    page.Command6_Click();
-    EXPECT_FALSE(lab.folders[QString()].contains(FtpFrmRig::first()));
 }
 
 } // namespace lumora

@@ -297,12 +297,6 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
     }
 }
 
-TEST_F(FtpSenderTest, AConnectionOpenedByHandIsClosedBeforeTheSending) {
-    walk();
-    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
-    EXPECT_EQ(told.number(AttemptBegins), 1);
-}
-
 TEST_F(FtpSenderTest, ARecheckThatDoesNotReachTheFolderSaysSo) {
     lists.List4Broken.append(path(u"01a.jpp"_s).text());
     lists.List6.append(u"01a.jpp"_s);

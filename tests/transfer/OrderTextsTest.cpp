@@ -18,7 +18,9 @@ TEST(OrderSummary, ShowsWhoOnlyForANewOrderAndDeliveryOnlyWhenAskedFor) {
     const QStringList resend = OrderSummaryLines(state, date);
     EXPECT_FALSE(resend.contains(u"Dana Levi"_s));
     EXPECT_EQ(resend.value(1), u" משלוח חוזר "_s);
-    EXPECT_EQ(resend.value(4), u"  משלוח עד הבית  "_s);
+    EXPECT_EQ(resend.value(4), u" משלוח עד הבית "_s);
+    state.OperatorArea = false; // no button opens the details
+    EXPECT_EQ(OrderSummaryLines(state, date).value(2), u" משלוח עד הבית "_s);
 }
 
 TEST(OrderSummary, IsDrawnDarkOnWhiteFromTheSideOfItsLanguage) {

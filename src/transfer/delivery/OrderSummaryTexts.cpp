@@ -19,14 +19,17 @@ constexpr int letterHeight = 14;
 
 QStringList OrderSummaryLines(const SessionState& state, const QDate& date) {
     QStringList lines{date.toString(u"dd/MM/yyyy"_s)};
-    if (state.transfer.SugMishloah == Sending::Resend)
-        lines += {state.wording(u" משלוח חוזר "_s, u" Resend "_s),
-                  state.wording(u" כדי לראות פרטי הזמנה לחץ על "_s, u" To see the order's details press "_s),
+    const bool resend = state.transfer.SugMishloah == Sending::Resend;
+    if (resend)
+        lines += state.wording(u" משלוח חוזר "_s, u" Resend "_s);
+    // The button that these lines name opens the operator's area.
+    if (resend && state.OperatorArea)
+        lines += {state.wording(u" כדי לראות פרטי הזמנה לחץ על "_s, u" To see the order's details press "_s),
                   state.wording(u" הצג יותר פרטים "_s, u" Show more details "_s)};
-    else
+    if (!resend)
         lines += {state.shemot.n1, state.shemot.n2};
     if (state.MishloachHabaita)
-        lines += state.wording(u"  משלוח עד הבית  "_s, u"  Home delivery  "_s);
+        lines += state.wording(u" משלוח עד הבית "_s, u" Home delivery "_s);
     lines += state.shemot.ppr + state.shemot.Bord + u' ' + state.shemot.maat;
     lines += state.shemot.Hearot;
     lines += state.wording(u" סך תמונות "_s, u" Total pictures "_s) + QString::number(state.shemot.TotalPics);

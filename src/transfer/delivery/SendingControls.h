@@ -17,6 +17,11 @@ struct SendingControls : Controls {
     Caption Pic4Failure{*this, u"Pic4Failure", Caption::At::Hidden};   // card of the failure, at the end
     Caption Command28{*this, u"Command28", Caption::At::Hidden};       // new order
     Caption Image3{*this, u"Image3"};                                  // close
+
+    // What the operator's area tells of the order.
+    Caption Label4Hokhaha{*this, u"Label4Hokhaha", Caption::At::Hidden};   // arrival is proven by names only
+    Caption Label4Dooach{*this, u"Label4Dooach", Caption::At::Hidden};     // a report was begun, its end is unknown
+    Caption Command4Dooach{*this, u"Command4Dooach", Caption::At::Greyed}; // report again
 };
 
 } // namespace lumora

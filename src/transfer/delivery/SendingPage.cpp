@@ -83,7 +83,19 @@ void SendingPage::tellPhase() {
     m_shown.Label4Do.text = advice(row);
     m_shown.Label4Order.text = wording(u"ההזמנה שלך", u"Your order");
     m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
+    showReporting();
     showPhase(row);
+}
+
+void SendingPage::showReporting() {
+    m_shown.Label4Hokhaha.text = wording(u"ההגעה הוכחה לפי שמות בלבד: השרת אינו מוסר אורכים.",
+                                         u"Arrival is proven by names only: the server tells no lengths.");
+    m_shown.Label4Dooach.text = wording(u"הדיווח למעבדה התחיל, ולא ידוע אם התקבל.",
+                                        u"The report to the lab was begun, and it is not known whether it was heard.");
+    m_shown.Command4Dooach.text = wording(u"דווח שוב", u"Report again");
+    m_shown.Label4Hokhaha.visible = provenByNameOnly();
+    m_shown.Label4Dooach.visible = reportUnknown();
+    m_shown.Command4Dooach.enabled = mayReportAgain();
 }
 
 SendingGauge SendingPage::gauge() const {

@@ -87,6 +87,7 @@ private:
     void activate();
     void reportAgain();
     void watchReport();
+    void showReporting();
     const LabReport& report() const { return const_cast<SendingPage*>(this)->report(); }
 
     SendingControls& m_shown;

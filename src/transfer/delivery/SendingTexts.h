@@ -11,6 +11,9 @@ inline constexpr SendingWords sentTitle{u"ההזמנה נשלחה", u"Your order
 inline constexpr SendingWords notCompleteTitle{u"השליחה לא הושלמה", u"The sending is not complete"};
 
 inline constexpr SendingWords noOrderAdvice{u"אין כאן הזמנה לשליחה.", u"There is no order to send here."};
+inline constexpr SendingWords refusedAdvice{
+    u"לא נשלח דבר. ההזמנה שמורה במחשב זה וניתן לשלוח אותה מתוך ההזמנות המוכנות.",
+    u"Nothing was sent. The order is kept on this computer and can be sent from the finished orders."};
 inline constexpr SendingWords noServerAdvice{
     u"לא הוגדר שרת לקבלת הזמנות. ההזמנה שמורה במחשב זה. יש להודיע לחנות.",
     u"No server is set for orders. The order is kept on this computer. Please tell the shop."};

@@ -13,7 +13,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-const QString filesToSend = u"*.gbr;*.jpp;*.prk"_s;
 constexpr int countdownTick = 1000;
 constexpr int blinkTick = 500;
 constexpr int countdownFrom = 15;
@@ -25,7 +24,7 @@ constexpr int secondsAfterFailure = 10;
 
 FtpFrm::FtpFrm(SessionState& state, const Platform& platform, PageChain& chain)
     : SendingPage(PageId::FtpFrm, state, platform, chain, *this, Countdown(countdownFrom, countdownEnd))
-    , File1(platform.files, filesToSend)
+    , m_files(platform.files)
     , Timer1(countdownTick, [this] { countSecond(); })
     , Timer2(blinkTick, [this] { blink(); })
     , Timer4Line(countdownTick, [this] { watchLine(); })
@@ -64,9 +63,13 @@ bool FtpFrm::inPieces() const {
     return m_state.transfer.Mefurak == Travel::Pieces;
 }
 
+bool FtpFrm::busy() const {
+    return isUnderWay(phase()) || m_byHand;
+}
+
 // The start controls do nothing during a sending, before the order is listed and after all has arrived.
 bool FtpFrm::canSend() const {
-    return !isUnderWay(phase()) && !hasArrived(phase()) && phase() != SendingPhase::Preparing && !m_sender.stop.left;
+    return !busy() && !hasArrived(phase()) && phase() != SendingPhase::Preparing && !m_sender.stop.left;
 }
 
 void FtpFrm::stopTimers() {
@@ -160,7 +163,7 @@ void FtpFrm::sendOrder() {
 }
 
 void FtpFrm::stopSending() {
-    if (!isUnderWay(phase()))
+    if (!busy())
         return;
     m_sender.stopNow();
     Command15.enabled = Command21.enabled = false;
@@ -225,8 +228,8 @@ void FtpFrm::leave() {
     m_sender.leave();
     stopTimers();
     Timer4Line.stop();
-    // During a pass the session may be inside a call; the pass closes it at its next step.
-    if (!isUnderWay(phase()))
+    // The session may be inside a call; what made the call closes it at its next step.
+    if (!busy())
         m_sender.session.closeSession();
 }
 
@@ -249,7 +252,7 @@ void FtpFrm::stay() {
 }
 
 void FtpFrm::leaveForAnother() {
-    if (!isUnderWay(phase()))
+    if (!busy())
         leaveForNewOrder();
 }
 
@@ -278,7 +281,7 @@ void FtpFrm::showProof() {
 void FtpFrm::FtpEnableControls(bool enable) {
     chkPassive.enabled = optBin.enabled = optAscii.enabled = enable;
     cmdClosehOpen.visible = enable;
-    cmdInternetOpen.visible = txtProxy.visible = !enable;
+    cmdInternetOpen.visible = txtProxy.visible = Label4Proxy.visible = !enable;
 }
 
 } // namespace lumora

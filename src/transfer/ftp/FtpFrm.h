@@ -44,29 +44,31 @@ public:
     void Command22_Click() { sendChainAfterFault(); }
 
     // Events of the lab's own area.
-    void Command13_Click() { beginNewOrder(); }
-    void Command1_Click() { beginResend(); }
+    void Command13_Click() { listNewOrder(); }
+    void Command1_Click() { listResend(); }
     void Command2_Click() { refillAndSendInRounds(); }
     void Command4_Click() { sendInRounds(); }
     void Command17_Click() { sendChosenOrder(); }
     void Command19_Click() { sendChain(); }
     void Command25_Click() { checkChosenOrder(); } // BdikaAfterUploadB
 
-    // Events that no control sends; in FtpFrmUnused.cpp.
-    void Command26_Click() { showProof(); }
-    void Command27_Click();
-    void Command3_Click();
-    void Command5_Click();
-    void Command6_Click();
-    void Command7_Click();
-    void cmdInternetOpen_Click();
-    void cmdClosehOpen_Click();
+    void ListRezefFiles_Click(int index) { chooseOrder(index); }
+    void cmdInternetOpen_Click() { openByHand(); }
+    void cmdClosehOpen_Click() { closeByHand(); }
+    void chkPassive_Click(bool checked) { choosePassive(checked); }
     void optBin_Click() { chooseType(true); }
     void optAscii_Click() { chooseType(false); }
-    void chkPassive_Click(bool checked);
-    void File1_Click(int index);
-    void List2_Click(int index);
-    void ListRezefFiles_Click(int index);
+    void txtProxy_Change(const QString& text) { takeProxy(text); }
+    void File1_Click(int index) { chooseLocal(index); }
+    void List2_Click(int index) { chooseRemote(index); }
+    void Command3_Click() { putChosen(); }
+    void Command5_Click() { getChosen(); }
+    void Command6_Click() { removeChosen(); }
+    void Command7_Click() { makeRemoteFolder(); }
+
+    // Events and routines that no control calls; in FtpFrmUnused.cpp.
+    void Command26_Click() { showProof(); }
+    void Command27_Click();
     void takeChain(const QStringList& folderNames); // fills ListRezefFiles
     // Prepares a resend of a folder from File1, as the page of finished orders does.
     void PrepareResendHere(const DrivePath& folder);
@@ -77,7 +79,6 @@ public:
     const FtpFrmControls& controls() const override { return *this; }
     const FtpLists& lists() const { return m_sender.lists; }
     const FtpSender& sender() const { return m_sender; }
-    const FileList& files() const { return File1; }
     bool counting() const { return Timer1.running(); }
     std::int16_t AllDone() const { return phase() == SendingPhase::Success ? 1 : 0; }
 
@@ -106,6 +107,7 @@ private:
     void leaveForAnother();
     void openOrderFolder();
     void showLabArea(bool shown);
+    bool busy() const; // the line is in use
     bool canSend() const;
     bool inPieces() const;
     void finish(SendingPhase end);
@@ -132,6 +134,12 @@ private:
     void showNumberTaken(const QString& number);
     void showNoServerBoxes();
 
+    // FtpFrmLabTexts.cpp
+    void setLabTexts();
+    void showHasArrived();
+    void showFailedByHand();
+    void showStoppedByHand();
+
     // FtpFrmEvents.cpp
     void reached(SendingMoment moment, int number) override;
     void progressed(int index, int count) override;
@@ -151,6 +159,8 @@ private:
     bool settingsFound();
     void clearLists();
     void listFolder();
+    void listFiles(const DrivePath& folder, const QString& pattern);
+    QStringList filesForResend(const DrivePath& folder);
     void addProofPicture();
     void countPictures();
     void ShowOrderSummary();
@@ -158,6 +168,9 @@ private:
     void refuseOrder();
 
     // FtpFrmLabArea.cpp
+    bool mayAct() const;
+    void listNewOrder();
+    void listResend();
     void refillAndSendInRounds();
     void sendInRounds();
     void sendChosenOrder();
@@ -165,13 +178,27 @@ private:
     void sendChainAfterFault();
     void SendChainOrder(const QString& name);
     void checkChosenOrder();
+    void chooseOrder(int index);
+    void showLabButtons();
 
-    // FtpFrmUnused.cpp
-    bool inSession(const QString& message);
-    void chooseType(bool binary);
+    // FtpFrmManual.cpp
+    template <class Step>
+    void byHand(const Step& step);
+    bool inSession();
     QString chosenRemoteName();
+    void openByHand();
+    void closeByHand();
+    void choosePassive(bool passive);
+    void chooseType(bool binary);
+    void takeProxy(const QString& text);
+    void chooseLocal(int index);
+    void chooseRemote(int index);
+    void putChosen();
+    void getChosen();
+    void removeChosen();
+    void makeRemoteFolder();
 
-    FileList File1;
+    FileList m_files;  // the names of File1
     Ticker Timer1;     // 1000 ms: the countdown
     Ticker Timer2;     // 500 ms: the blinking
     Ticker Timer4Line; // 1000 ms: the watch over the line
@@ -180,7 +207,9 @@ private:
     int m_fileCount = 0;      // files found in the folder
     std::optional<int> m_printCount;
     std::optional<int> m_minutesLeft; // known from the second piece on
+    bool m_refused = false;           // the customer or a guard did not let the order leave
     bool m_incomplete = false;        // the pass has left files behind
+    bool m_byHand = false;            // a step of the manual panel is under way
     // Command26 shows the proof picture if a page has set both; none does.
     bool m_proofWanted = false;
     QString m_proofText;

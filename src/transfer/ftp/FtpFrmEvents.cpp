@@ -213,7 +213,10 @@ void FtpFrm::pieceSent(double share, std::optional<int> minutes) {
 
 void FtpFrm::failed(LineStep step, const Failure& failure, const QString& subject) {
     Label5.text = m_sender.session.RemoteDirectory;
-    tellReason(step, failure, subject);
+    if (m_byHand) // a step by hand is no reason why an order was not sent
+        status(LineTroubleText(m_state, step, failure, subject));
+    else
+        tellReason(step, failure, subject);
 }
 
 void FtpFrm::brokenNotKept(const Failure& failure) {

@@ -4,20 +4,45 @@
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "transfer/delivery/OrderFiles.h"
+#include "transfer/delivery/StoppableLine.h"
 #include "transfer/ftp/FtpFrm.h"
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+// Before the order is listed and while the line is in use no button of the area does anything.
+bool FtpFrm::mayAct() const {
+    return !busy() && phase() != SendingPhase::Preparing && !m_sender.stop.left;
+}
+
+void FtpFrm::listNewOrder() {
+    if (!mayAct())
+        return;
+    if (hasArrived(phase()))
+        showHasArrived();
+    else
+        beginNewOrder();
+}
+
+void FtpFrm::listResend() {
+    if (!mayAct())
+        return;
+    if (hasArrived(phase()))
+        showHasArrived();
+    else
+        beginResend();
+}
+
 void FtpFrm::refillAndSendInRounds() {
-    if (isUnderWay(phase()) || phase() == SendingPhase::Success)
+    if (!mayAct() || hasArrived(phase()) || !settingsFound())
         return;
     // List3 would get the proof picture alone, and its arrival would count as that of the order.
     if (m_handedOver.isEmpty()) {
         m_platform.dialogs.message(u"list3 is empty"_s);
         return;
     }
+    stopTimers(); // the count must not end while the guard asks
     m_sender.lists.List3.clear();
     m_sender.lists.List3.append(BulkFiles(m_handedOver, inPieces()));
     addProofPicture();
@@ -31,7 +56,7 @@ void FtpFrm::refillAndSendInRounds() {
 }
 
 void FtpFrm::sendInRounds() {
-    if (isUnderWay(phase()) || phase() == SendingPhase::Success || m_sender.stop.left)
+    if (!mayAct() || hasArrived(phase()) || !settingsFound())
         return;
     // A list that no order has begun with is none to send.
     if (lists().List3.isEmpty() || lists().List4Makor.isEmpty()) {
@@ -39,20 +64,24 @@ void FtpFrm::sendInRounds() {
         return;
     }
     const std::optional<SendingPhase> end = m_sender.runOlderRounds();
-    if (end == SendingPhase::NumberTaken)
+    if (end == SendingPhase::NumberTaken) {
         prepareAgain();
-    else if (end)
+        return;
+    }
+    if (end == SendingPhase::NotAll)
+        showFailure();
+    if (end)
         finish(*end);
 }
 
 void FtpFrm::sendChosenOrder() {
-    if (isUnderWay(phase()) || lists().ListRezefFiles.currentIndex() < 0)
+    if (!mayAct() || lists().ListRezefFiles.currentIndex() < 0)
         return;
     SendChainOrder(lists().ListRezefFiles.currentItem());
 }
 
 void FtpFrm::sendChain() {
-    if (isUnderWay(phase()))
+    if (!mayAct())
         return;
     TextList& chain = m_sender.lists.ListRezefFiles;
     for (int i = 0; i < chain.count() && !m_sender.stop.left; ++i) {
@@ -73,6 +102,7 @@ void FtpFrm::SendChainOrder(const QString& name) {
     const DrivePath folder = WorkspacePaths::orders(m_state) / name;
     std::optional<SendingPhase> end = SendingPhase::NoOrder;
     m_sender.pass.UserStopped = 0;
+    m_sender.stop.StopFlag = false;
     if (m_platform.files.folderExists(folder)) {
         m_state.transfer.OrderFolder = folder;
         listFolder();
@@ -80,7 +110,10 @@ void FtpFrm::SendChainOrder(const QString& name) {
         if (mayBeSent()) {
             m_sender.beginOrder();
             m_state.transfer.ShemTikiya = name;
-            m_sender.check.ListServerFiles();
+            {
+                const StoppableLine line(m_platform);
+                m_sender.check.ListServerFiles();
+            }
             m_sender.check.DropAlreadySent();
             end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
         }
@@ -96,7 +129,7 @@ void FtpFrm::SendChainOrder(const QString& name) {
 }
 
 void FtpFrm::sendChainAfterFault() {
-    if (isUnderWay(phase()))
+    if (!mayAct())
         return;
     Command22.visible = false;
     m_sender.pass.FaultPressed = true;
@@ -106,13 +139,34 @@ void FtpFrm::sendChainAfterFault() {
 }
 
 void FtpFrm::checkChosenOrder() {
-    if (isUnderWay(phase()) || lists().ListRezefFiles.currentIndex() < 0)
+    if (!mayAct() || lists().ListRezefFiles.currentIndex() < 0)
         return;
+    holdCount();
     const SendingPhase before = phase();
     m_state.transfer.ShemTikiya = lists().ListRezefFiles.currentItem();
+    m_sender.stop.StopFlag = false;
     enter(SendingPhase::Checking);
-    m_sender.check.ListServerFiles();
+    {
+        const StoppableLine line(m_platform);
+        m_sender.check.ListServerFiles();
+    }
     enter(before);
+}
+
+void FtpFrm::chooseOrder(int index) {
+    m_sender.lists.ListRezefFiles.setCurrentIndex(index);
+    Q_EMIT changed();
+}
+
+void FtpFrm::showLabButtons() {
+    const bool chain = !lists().ListRezefFiles.isEmpty();
+    Label4Rezef.visible = !chain;
+    Command17.enabled = Command19.enabled = Command25.enabled = chain && mayAct();
+    Command13.enabled = Command1.enabled = mayAct();
+    Command2.enabled = Command4.enabled = mayAct() && !hasArrived(phase());
+    for (Caption* manual : {&cmdInternetOpen, &cmdClosehOpen, &Command3, &Command5, &Command6, &Command7})
+        manual->enabled = mayAct();
+    Q_EMIT changed();
 }
 
 } // namespace lumora

@@ -3,6 +3,8 @@
 #include "editing/editor/gdisave.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
+#include "order/OrderNames.h"
+#include "order/PieceName.h"
 #include "order/PrintCode.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -36,21 +38,50 @@ void FtpFrm::clearLists() {
         Label46.text = m_state.transfer.ShemTikiya;
 }
 
+void FtpFrm::listFiles(const DrivePath& folder, const QString& pattern) {
+    m_files.setPattern(pattern);
+    m_files.setFolder(folder);
+    m_files.refresh();
+    m_sender.lists.File1.clear();
+    m_sender.lists.File1.append(m_files.names());
+}
+
 void FtpFrm::listFolder() {
     const OrderFolder order = OrderFolder::chosen(m_state);
     clearLists();
-    File1Index = -1;
+    m_sender.lists.File1.clear();
     if (!order.isChosen()) {
         showFileCount(0);
         return;
     }
-    File1.setFolder(order.path());
-    File1.refresh();
-    showFileCount(File1.count());
+    listFiles(order.path(), u"*.gbr;*.jpp;*.prk"_s);
+    showFileCount(m_files.count());
     ReadOrderDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
-    m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, order, File1.names(), inPieces()));
+    m_sender.lists.List3.append(FtpOrderFiles(m_platform.files, order, m_files.names(), inPieces()));
     addProofPicture();
+}
+
+// As the page of finished orders chooses them: the log, then the sheets and prints or, of an order in pieces, the
+// pieces.
+QStringList FtpFrm::filesForResend(const DrivePath& folder) {
+    const bool pieces = TravelsInPieces(folder.text());
+    if (pieces) {
+        m_state.transfer.Mefurak = Travel::Pieces;
+        m_state.transfer.HazmanaP = 1;
+    }
+    listFiles(folder, pieces ? u"*.jpp;*.prk;*.txt"_s : u"*.jpp;*.txt"_s);
+    const OrderFolder order(folder);
+    QStringList paths;
+    if (m_platform.files.fileExists(order.logPath()))
+        paths += order.logPath().text();
+    for (const QString& entry : m_files.names()) {
+        const DrivePath path = folder / entry;
+        if ((!inPieces() || IsPiece(entry) || IsSheet(entry)) && path != order.logPath() &&
+            path != order.brokenFilesPath())
+            paths += path.text();
+    }
+    return paths;
 }
 
 void FtpFrm::addProofPicture() {
@@ -81,6 +112,7 @@ void FtpFrm::ShowOrderSummary() {
 void FtpFrm::refuseOrder() {
     if (m_sender.stop.left)
         return;
+    m_refused = !lists().List3.isEmpty();
     clearLists();
     enter(SendingPhase::NoOrder);
 }
@@ -121,17 +153,15 @@ void FtpFrm::beginResend() {
         enter(SendingPhase::NoOrder);
         return;
     }
-    if (m_handedOver.isEmpty()) {
-        // The proof picture alone would count as the order.
-        listFolder();
-    } else {
-        FtpLists& lists = m_sender.lists;
-        lists.List3.append(m_handedOver);
-        showFileCount(lists.List3.count());
-        ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
-        ShowOrderSummary();
-        addProofPicture();
-    }
+    m_state.transfer.SugMishloah = Sending::Resend;
+    FtpLists& lists = m_sender.lists;
+    const QStringList all = filesForResend(order.path());
+    lists.List3.append(m_handedOver.isEmpty() ? all : m_handedOver);
+    showFileCount(lists.List3.count());
+    ReadResentDetails(m_platform.files, order.logPath(), m_state.shemot);
+    ShowOrderSummary();
+    if (!lists.List3.isEmpty())
+        addProofPicture(); // alone it would count as the order
     armCountdown();
 }
 

@@ -29,7 +29,7 @@ std::span<const PhaseLook> FtpFrm::looks() const {
     static constexpr std::array rows{
         PhaseLook{SendingPhase::Preparing,
                   SendingSign::Seconds,
-                  SendNow,
+                  None,
                   {SendNow, Hold},
                   sendingTitle,
                   {u"קוראים את ההזמנה. נא להמתין.", u"Reading the order. Please wait."}},
@@ -97,6 +97,8 @@ QString FtpFrm::advice(const PhaseLook& row) const {
             u"להודיע לחנות.",
             u"The server did not tell what has arrived. Press Send again to check and send once more. If "
             u"this comes again, please tell the shop.");
+    if (row.phase == SendingPhase::NoOrder && m_refused)
+        return wording(refusedAdvice);
     const QString text = wording(row.advice);
     return text.contains(u'%') ? text.arg(m_sender.check.NumOnServer).arg(m_sender.NumToSend) : text;
 }
@@ -107,7 +109,13 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     const bool ended = row.main == SendAgain || row.phase == SendingPhase::CallLab;
     Command15.enabled = Command21.enabled = underWay;
     Command15.visible = row.buttons.testFlag(Stop);
+    if (row.phase == SendingPhase::NoOrder && m_refused)
+        Label4Title.text = wording(notCompleteTitle);
     Image5.visible = row.buttons.testFlag(SendNow);
+    Image5.enabled = Command23.enabled = row.main == SendNow; // before that no order is listed
+    if (!underWay && row.phase != SendingPhase::Preparing)
+        Picture1.visible = false;
+    Pic4Blink.visible = row.sign == SendingSign::Seconds;
     Command23.visible = row.buttons.testAnyFlags(SendingButtons(Hold) | GoOn);
     Command10.visible = row.buttons.testFlag(SendAgain);
     Command11.visible = Command11.enabled = row.buttons.testFlag(Close);
@@ -116,6 +124,7 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Pic4Failure.visible = ended && (m_incomplete || !reason().isEmpty());
     Pic4Order.visible = row.phase != SendingPhase::Success; // Picture2 stands in its place
     showMinutes();
+    showLabButtons();
 }
 
 void FtpFrm::showMinutes() {
@@ -132,7 +141,6 @@ void FtpFrm::setTexts() {
          {Command10, u"שלח שוב", u"Send again"},
          {Command28, u"הזמנה חדשה", u"New order"},
          {Command15, u"עצור", u"Stop"},
-         {Command21, u"Stop"},
          {Command18, u"עצור ספירה", u"Stop the count"},
          {Command11, u"יציאה", u"Exit"},
          {Command8, u"יציאה", u"Exit"},
@@ -145,40 +153,23 @@ void FtpFrm::setTexts() {
          {Image3, u"סגור", u"Close"},
          {Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder"},
          {Image5, u"שלח עכשיו", u"Send now"},
-         {Command13, u"לפני שליחה", u"Before sending"},
-         {Command1, u"משלוח חוזר", u"Resend"},
-         {Command2, u"מילוי ושליחה", u"Refill and send"},
-         {Command4, u"שליחה בסבבים", u"Send in rounds"},
-         {Command3, u"put"},
-         {Command5, u"get"},
-         {Command6, u"del"},
-         {Command7, u"make dir"},
-         {Command17, u"SendOneOrder"},
-         {Command19, u"All Orders"},
-         {Command25, u"BdikaAfterUploadB"},
          {Command27, u"Copy"},
          {Label15, u"רשום לפננו שבקשת לקבל את התמונות המודפסות במשלוח לביתך",
           u"We have noted that you asked to get the printed pictures by delivery to your home"},
          {Label4Nichshal, u"המחשב לא הצליח להעלות ", u"The computer failed to upload "},
          {Label4Mitoch, u"קבצים מתוך ", u"files out of "},
          {Label4Yooadoo, u" קבצים שיועדו למשלוח ", u" files meant for sending "},
-         {Label4Hamtana, u"מומלץ להמתין 30 שניות ואז ללחוץ על הלחצן  שלח שוב",
-          u"It is advised to wait 30 seconds and then press Send again"},
          {Label9, u"ההזמנה שמורה במחשב זה, וקבצים שכבר הגיעו לשרת לא יישלחו שוב.",
           u"The order is kept on this computer, and files that have arrived are not sent again."},
          {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
          {Label4Minutes, u"דקות", u"minutes"},
          {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
          {Label4Summary, u"סיכום ההזמנה", u"Summary of your order"},
-         {Label4ToSend, u"קבצים לשליחה", u"Files to be sent"},
-         {Label4OnServer, u"נמצאים בשרת", u"On the server"},
-         {Label4Failed, u"שליחה שנכשלה", u"Failed"},
-         {Label4Log, u"יומן", u"Log"},
          {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
           u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
           u"pictures "
           u"will be printed."}});
-    txtProxy.hint = u"TIS Compatible Proxy (No CERN):"_s;
+    setLabTexts();
     showCounts();
     tellPhase();
     Q_EMIT changed();
@@ -209,7 +200,7 @@ void FtpFrm::showStoppedBoxes() {
     dialogs.message(wording(u" התהליך הופסק ביוזמת המשתמש ", u" The process was stopped by the user "));
     dialogs.message(wording(u"אם תרצה להמשיך המשלוח לחץ על לחצן שלח דרך האינטרנט\r"
                             u"אם אינך מתכוון להמשיך במשלוח הנך מתבקש להודיע על כך לחנות תודה",
-                            u"To go on, press the button that sends through the internet.\r"
+                            u"To go on with the sending, press Send again.\r"
                             u"If you do not mean to go on, please tell the shop. Thank you."));
 }
 

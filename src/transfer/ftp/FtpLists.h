@@ -9,6 +9,7 @@ namespace lumora {
 
 // The working lists of the FTP sender, under the names that the lab's people use.
 struct FtpLists {
+    TextList File1;          // names in the order's folder on this machine
     TextList List1;          // names in the FTP home directory
     TextList List2;          // names after a make-dir or a manual operation
     TextList List3;          // full local paths of the files of the present pass
@@ -26,7 +27,8 @@ struct FtpLists {
     TextList List4Tikiyot;   // folders of Command27; no page fills it
 
     std::vector<std::pair<const char16_t*, const TextList*>> named() const {
-        return {{u"List1", &List1},
+        return {{u"File1", &File1},
+                {u"List1", &List1},
                 {u"List2", &List2},
                 {u"List3", &List3},
                 {u"List4", &List4},

@@ -33,6 +33,10 @@ UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain&
     showAnswers();
 }
 
+void UploadForm::load() {
+    Command24.visible = m_state.OperatorArea;
+}
+
 void UploadForm::begin() {
     refreshList();
 }
@@ -73,6 +77,7 @@ void UploadForm::refreshList() {
 void UploadForm::findMissing() {
     if (!idle())
         return;
+    m_refused = false;
     if (lists().List4Kvazim.isEmpty()) {
         enter(SendingPhase::NoOrder);
         return;
@@ -82,6 +87,7 @@ void UploadForm::findMissing() {
         return;
     }
     if (!mayBeSent()) {
+        m_refused = true;
         if (!m_sender.stop.left)
             enter(SendingPhase::NoOrder);
         return;

@@ -69,6 +69,10 @@ std::span<const PhaseLook> UploadForm::looks() const {
     return rows;
 }
 
+QString UploadForm::advice(const PhaseLook& row) const {
+    return wording(row.phase == SendingPhase::NoOrder && m_refused ? refusedAdvice : row.advice);
+}
+
 void UploadForm::showPhase(const PhaseLook& row) {
     using enum SendingButton;
     Image5.visible = row.buttons.testFlag(SendAgain);
@@ -77,10 +81,13 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Command10.visible = row.buttons.testFlag(GoOn);
     endClose.visible = row.buttons.testFlag(Close);
     Label11.visible = row.phase == SendingPhase::AllThere;
+    if (!isUnderWay(row.phase) && row.phase != SendingPhase::Preparing)
+        Pic4Hamten.visible = false;
     showCount();
     showTrouble();
     showLeft();
     showOrder();
+    showLabButtons();
 }
 
 void UploadForm::showCount() {
@@ -134,6 +141,7 @@ void UploadForm::setTexts() {
                           {Label4Rshom, u"נא לרשום את מספר ההזמנה ", u"Please write down the order number"},
                           {Label4Alu, u" הקבצים עלו בהצלחה ", u"The files went up successfully"},
                           {Label4Tashlum, u"נא להתקשר לחנות לגבי תשלום", u"Please call the shop about payment"}});
+    setLabTexts();
     tellPhase();
     Q_EMIT changed();
 }
