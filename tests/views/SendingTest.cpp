@@ -101,6 +101,9 @@ TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
     EXPECT_TRUE(waits.empty());
     look(walk, u"19-failed"_s);
     pressAndLook(walk, u"FtpFrm"_s, u"Command24"_s, u"22-for-the-lab"_s);
+    walk.press(u"FtpFrm"_s, u"cmdClosehOpen"_s);
+    pressAndLook(walk, u"FtpFrm"_s, u"cmdInternetOpen"_s, u"22-by-hand"_s);
+    EXPECT_TRUE(walk.pressable(u"FtpFrm"_s, u"Command3"_s));
     walk.press(u"FtpFrm"_s, u"Command9"_s);
 
     lab.putFaults.clear();
@@ -187,6 +190,8 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
         page.Timer2_Tick();
     EXPECT_EQ(page.phase(), SendingPhase::NotAll);
     look(walk, u"65-http-failed"_s);
+    pressAndLook(walk, u"UploadForm"_s, u"Command24"_s, u"65-http-for-the-lab"_s);
+    walk.press(u"UploadForm"_s, u"Command9"_s);
 
     lab.deadCalls = lab.deadPosts = 0;
     lookWhen(u"66-http-verifying"_s, [&] { return page.phase() == SendingPhase::Checking; });

@@ -14,6 +14,7 @@
 #include <QListWidget>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
+#include <QScrollArea>
 
 #include <algorithm>
 #include <cmath>
@@ -62,6 +63,14 @@ void click(QWidget& widget, QPoint at) {
 QPoint pointOf(const QWidget& widget, QPointF percent) {
     return {std::clamp(static_cast<int>(std::lround(percent.x() / 100 * widget.width())), 0, widget.width() - 1),
             std::clamp(static_cast<int>(std::lround(percent.y() / 100 * widget.height())), 0, widget.height() - 1)};
+}
+
+// A person scrolls to what lies outside the window.
+void bringIntoSight(QWidget& widget) {
+    for (QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
+        if (auto* area = qobject_cast<QScrollArea*>(parent))
+            area->ensureWidgetVisible(&widget);
+    }
 }
 
 QString unusable(const QWidget& widget) {
@@ -151,6 +160,7 @@ Result<QWidget*> ControlFinder::inSight(const QString& page, const QString& cont
     QWidget* widget = bound ? bound->widget.data() : (*found)->findChild<QWidget*>(control);
     if (!widget)
         return fail(u"%1 has no control %2 that can be pressed"_s.arg(page, control));
+    bringIntoSight(*widget);
     const QString why = unusable(*widget);
     if (!why.isEmpty())
         return fail(u"%1.%2 is %3"_s.arg(page, control, why));

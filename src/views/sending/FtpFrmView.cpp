@@ -4,7 +4,6 @@
 #include "views/kit/Cards.h"
 #include "views/kit/Overlay.h"
 
-#include <QListWidget>
 #include <QProgressBar>
 
 namespace lumora {
@@ -40,13 +39,31 @@ void FtpFrmView::makeProgress() {
     const Card failure = makeSignedCard("alarm", u"warning"_s, Theme::Colour::Danger);
     bind(failure.frame, c.Pic4Failure);
     add(*failure.column, {label(c.Picture6, "strong"), label(c.Label2), label(c.Label4Reason), label(c.Label9)});
-    layOut({centred(label(c.Label3, "title")),
+    m_pause = movingBar(FtpFrmControls::Picture1Full);
+    bind(u"Picture1"_s, m_pause, [this] { return QString::number(c.Picture1Width); });
+    layOut({{blinkingSigns(), 0, Qt::AlignHCenter},
+            centred(label(c.Label3, "title")),
+            {m_pause, 0, Qt::AlignHCenter},
             centred(label(c.Label4File, "muted")),
             centred(label(c.Label34, "strong")),
             {m_pieces, 0, Qt::AlignHCenter},
             minutes,
             centred(label(c.Label4Do))},
            {failure.frame}, makeSide());
+}
+
+// One of the two signs is visible at a time.
+QWidget* FtpFrmView::blinkingSigns() {
+    QHBoxLayout* signs = inRow(Space::Normal);
+    for (const Caption* caption : {&c.Image10, &c.Image11}) {
+        QWidget* box = inBox(inRow(Space::None, {sign(u"upload"_s, IconSize::Line)}));
+        keepPlaceWhenHidden(*box);
+        bind(box, *caption);
+        signs->addWidget(box);
+    }
+    QWidget* both = inBox(signs);
+    follow(both, c.Pic4Blink);
+    return both;
 }
 
 QLayout* FtpFrmView::makeSide() {
@@ -96,41 +113,11 @@ void FtpFrmView::makeBars() {
                             asMain(SendingButton::SendNow, m_sendNow)});
 }
 
-// The lists of the sending and its manual steps, for the lab's people.
-void FtpFrmView::makeLabArea() {
-    QGridLayout* lists = inGrid(Space::Small);
-    const auto show = [&](int column, const QString& name, const TextList& of, const Caption& head) {
-        QLabel* title = label(head, "smallMuted");
-        QListWidget* made =
-            listing(of, [](const QString& item) { return item.contains(u'\\') ? LeafName(item) : item; });
-        lists->addWidget(title, 0, column);
-        lists->addWidget(made, 1, column);
-        title->setBuddy(made);
-        made->setAccessibleName(name);
-    };
-    const FtpLists& of = m_page.lists();
-    show(0, u"List3"_s, of.List3, c.Label4ToSend);
-    show(1, u"List6"_s, of.List6, c.Label4OnServer);
-    show(2, u"List7"_s, of.List7, c.Label4Failed);
-    show(3, u"LogList"_s, of.LogList, c.Label4Log);
-    QGridLayout* manual = inGrid(Space::Small);
-    const std::pair<const Caption&, void (FtpFrm::*)()> steps[] = {
-        {c.Command13, &FtpFrm::Command13_Click}, {c.Command1, &FtpFrm::Command1_Click},
-        {c.Command2, &FtpFrm::Command2_Click},   {c.Command4, &FtpFrm::Command4_Click},
-        {c.Command17, &FtpFrm::Command17_Click}, {c.Command19, &FtpFrm::Command19_Click},
-        {c.Command25, &FtpFrm::Command25_Click}};
-    for (int at = 0; const auto& [caption, pressed] : steps) {
-        manual->addWidget(button(caption, Role::Plain, pressed), at / 5, at % 5);
-        ++at;
-    }
-    m_labArea = new Overlay(theme(), this, {{lists, 1}, manual});
-    m_labArea->setFilling();
-    m_labArea->addButton(button(c.Command9, Role::Main, &FtpFrm::Command9_Click));
-    m_labArea->whenEscaped(toPage(&FtpFrm::Command9_Click));
-}
-
 void FtpFrmView::render() {
     SendingView::render();
+    m_pause->setVisible(c.Picture1.visible);
+    m_pause->setValue(c.Picture1Width);
+    m_chain->setVisible(!m_page.lists().ListRezefFiles.isEmpty());
     m_pieces->setVisible(c.PicInProgKatan.visible);
     m_pieces->setValue(c.PicInProgKatanWidth);
     m_pieces->setAccessibleName(c.PicInProgKatan.text);

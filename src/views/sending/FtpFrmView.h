@@ -24,10 +24,19 @@ private:
     void makeProgress();
     QLayout* makeSide();
     void makeBars();
+    QWidget* blinkingSigns();
+
+    // FtpLabAreaView.cpp
     void makeLabArea();
+    QLayout* makeSendingLists();
+    QLayout* makeChain();
+    QLayout* makeManual();
+    QPushButton* toggle(const CheckCaption& caption, void (FtpFrm::*clicked)());
 
     const Files& m_files;
     QProgressBar* m_pieces = nullptr;
+    QProgressBar* m_pause = nullptr;
+    QWidget* m_chain = nullptr; // the list of its orders
     QLabel* m_summary = nullptr;
     PictureBox* m_proof = nullptr;
     DrivePath m_proofFile;

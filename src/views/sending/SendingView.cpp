@@ -1,7 +1,12 @@
 #include "views/sending/SendingView.h"
 
+#include "common/DrivePath.h"
 #include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
+
+#include <QListWidget>
+#include <QProgressBar>
+#include <QScrollArea>
 
 #include <utility>
 
@@ -35,6 +40,57 @@ QPushButton* SendingView::asMain(SendingButton action, QPushButton* button) {
     return button;
 }
 
+QProgressBar* SendingView::movingBar(int full) {
+    auto* made = new QProgressBar(this);
+    setRole(made, "moving");
+    made->setRange(0, full);
+    made->setTextVisible(false);
+    made->setFixedWidth(theme().size(Extent::Bar));
+    return made;
+}
+
+void SendingView::addLabList(QGridLayout& to, const Caption& heading, const char16_t* name, const TextList& rows,
+                             std::function<void(int)> picked) {
+    const Reading shown = [](const QString& item) {
+        return fromLeft(item.mid(1, 2) == u":\\"_s ? LeafName(item) : item.trimmed());
+    };
+    QListWidget* made = picked ? list(rows, std::move(picked), shown) : listing(rows, shown);
+    setRole(made, "lab");
+    made->setLayoutDirection(Qt::LeftToRight);
+    made->setMinimumHeight(theme().px(110));
+    bindList(QString::fromUtf16(name), rows, made, shown);
+    QLabel* title = label(heading, "smallMuted");
+    title->setBuddy(made);
+    m_headed.emplace_back(&heading, made);
+    const int column = to.columnCount() - (to.count() == 0 ? 1 : 0);
+    to.addWidget(title, 0, column);
+    to.addWidget(made, 1, column);
+    to.setColumnStretch(column, 1);
+    to.setRowStretch(1, 1);
+}
+
+Overlay* SendingView::makeLabPanel(std::initializer_list<Item> parts, QPushButton* close) {
+    auto* scroll = new QScrollArea(this);
+    scroll->setWidgetResizable(true);
+    scroll->setFrameShape(QFrame::NoFrame);
+    scroll->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    scroll->setFocusPolicy(Qt::NoFocus);
+    scroll->setWidget(inBox(inRow(Space::None, {{inColumn(Space::Normal, parts), 1}, Space::Normal})));
+    auto* panel = new Overlay(theme(), this, {{scroll, 1}});
+    panel->setFilling();
+    panel->addButton(close);
+    return panel;
+}
+
+QLayout* SendingView::makeReporting() {
+    const SendingControls& shown = m_page.sendingControls();
+    QPushButton* again = button(
+        shown.Command4Dooach, Role::Plain, [&page = m_page] { page.Command4Dooach_Click(); }, u"resend"_s);
+    return inRow(
+        Space::Small,
+        {again, {inColumn(Space::None, {label(shown.Label4Dooach, "small"), label(shown.Label4Hokhaha, "small")}), 1}});
+}
+
 void SendingView::bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists) {
     for (const auto& [name, list] : lists) {
         if (!control(QString::fromUtf16(name)))
@@ -49,6 +105,8 @@ void SendingView::render() {
     frame().steps().setStep(hasArrived(look.phase) ? OrderStep::Done : OrderStep::Sending);
     frame().setTitle(shown.Label4Title.text);
     renderGauge();
+    for (const auto& [heading, list] : m_headed)
+        speak(list, heading->text);
     changeRole(m_mainActions.at(SendingButton::NewOrder), look.main == SendingButton::NewOrder ? "main" : "secondary");
     if (frontOverlay(*window()))
         return;

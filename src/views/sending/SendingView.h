@@ -5,9 +5,13 @@
 
 #include <map>
 
+class QGridLayout;
+class QProgressBar;
+
 namespace lumora {
 
 class Gauge;
+class Overlay;
 
 // The base of the two sending views: title, gauge, the main action of the phase and the keyboard that goes with it.
 class SendingView : public PageView {
@@ -22,6 +26,15 @@ protected:
     QLabel* orderName(const Caption& caption, const char* type);
     // The button that is the main action in the phases whose row names it.
     QPushButton* asMain(SendingButton action, QPushButton* button);
+    // A thin bar that moves and tells no number. full: its width in the page's terms.
+    QProgressBar* movingBar(int full);
+    // A list of the lab's own area as the next column, below its heading. Names run from left to right.
+    void addLabList(QGridLayout& to, const Caption& heading, const char16_t* name, const TextList& rows,
+                    std::function<void(int)> picked = {});
+    // The lab's own area: a panel over the page, which scrolls where it is higher than the window.
+    Overlay* makeLabPanel(std::initializer_list<Item> parts, QPushButton* close);
+    // What the lab's own area tells of arrival and report.
+    QLayout* makeReporting();
     // The lists of the rules, for scenarios and tests.
     void bindLists(const std::vector<std::pair<const char16_t*, const TextList*>>& lists);
 
@@ -33,6 +46,7 @@ private:
     SendingPage& m_page;
     Gauge* m_gauge;
     std::map<SendingButton, QPushButton*> m_mainActions;
+    std::vector<std::pair<const Caption*, QListWidget*>> m_headed;
     QWidget* m_main = nullptr; // what had the keyboard last
 };
 

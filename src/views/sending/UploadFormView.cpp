@@ -1,5 +1,12 @@
 #include "views/sending/UploadFormView.h"
 
+#include "views/kit/Overlay.h"
+
+#include <QPlainTextEdit>
+#include <QProgressBar>
+
+#include <tuple>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -13,9 +20,21 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
     const Card failure = makeSignedCard("alarm", u"warning"_s, Theme::Colour::Danger);
     add(*failure.column, {label(c.Label1, "strong"), label(c.Label4Reason)});
     bind(failure.frame, c.Pic4Failure);
-    layOut({centred(label(c.Label4Count, "title")), centred(label(c.Label4File, "muted")), centred(label(c.Label4Do))},
+    m_count = movingBar(UploadFormControls::Picture1FullWidth);
+    bind(u"Picture1"_s, m_count, [this] { return QString::number(c.Picture1Width); });
+    m_pause = movingBar(UploadFormControls::Pic4HamtenFull);
+    bind(u"Pic4Hamten"_s, m_pause, [this] { return QString::number(c.Pic4HamtenWidth); });
+    QWidget* starts = inBox(inRow(Space::None, {sign(u"upload"_s, IconSize::Line)}));
+    bind(starts, c.Picture5);
+    layOut({inRow(Space::Small, {Item::room(), starts, lineLabel(c.Label4Count, "title"), Item::room()}),
+            centred(label(c.Label9, "strong")),
+            {m_count, 0, Qt::AlignHCenter},
+            {m_pause, 0, Qt::AlignHCenter},
+            centred(label(c.Label4File, "muted")),
+            centred(label(c.Label4Do))},
            {trouble.frame, failure.frame}, makeSide());
     makeBars();
+    makeLabArea();
     bindLists(page.lists().named());
     start();
 }
@@ -30,7 +49,10 @@ QLayout* UploadFormView::makeSide() {
     add(*end.column, {label(c.Label4Alu, "large"), label(c.Label4Rshom), orderName(c.Label16, "large"),
                       label(c.Label4Tashlum), echo(c.Label4Tel, "large")});
     QPushButton* refresh = button(c.Command2, Role::Quiet, &UploadForm::Command2_Click, u"resend"_s);
-    return inColumn(Space::Normal, {order.frame, end.frame, Item::room(), {refresh, 0, Qt::AlignLeading}});
+    QPushButton* details = button(c.Command24, Role::Quiet, &UploadForm::Command24_Click, u"info"_s);
+    return inColumn(
+        Space::Normal,
+        {order.frame, end.frame, Item::room(), {refresh, 0, Qt::AlignLeading}, {details, 0, Qt::AlignLeading}});
 }
 
 void UploadFormView::makeBars() {
@@ -43,6 +65,56 @@ void UploadFormView::makeBars() {
     frame().addMainActions(
         {asMain(SendingButton::NewOrder, button(c.Command28, Role::Secondary, &UploadForm::Command28_Click)),
          asMain(SendingButton::GoOn, goOn), asMain(SendingButton::SendAgain, again)});
+}
+
+QPlainTextEdit* UploadFormView::answer(const Caption& caption) {
+    auto* made = new QPlainTextEdit(this);
+    setRole(made, "lab");
+    made->setReadOnly(true);
+    made->setFocusPolicy(Qt::NoFocus);
+    made->setLayoutDirection(Qt::LeftToRight);
+    made->setMinimumHeight(theme().size(Extent::Drawing));
+    bindName(made, caption);
+    return made;
+}
+
+void UploadFormView::makeLabArea() {
+    const HttpLists& of = m_page.lists();
+    QGridLayout* lists = inGrid(Space::Small);
+    addLabList(*lists, c.Label4Kvazim, u"List4Kvazim", of.List4Kvazim);
+    addLabList(*lists, c.Label4Hossarim, u"List4Hossarim", of.List4Hossarim);
+    addLabList(*lists, c.Label4AfterWeb, u"ListAfterWeb", of.ListAfterWeb);
+    addLabList(*lists, c.Label4InOrder, u"ListInOrder", of.ListInOrder);
+    m_answer = answer(c.TxtWeb);
+    m_listFile = answer(c.TxtFromWeb);
+    QLayout* answers =
+        inRow(Space::Small, {{inColumn(Space::Tight, {label(c.Label4Answer, "smallMuted"), {m_answer, 1}}), 1},
+                             {inColumn(Space::Tight, {label(c.Label4ListFile, "smallMuted"), {m_listFile, 1}}), 1}});
+    QLayout* query =
+        inRow(Space::Small, {lineLabel(c.Label4Query, "smallMuted"), lineLabel(c.TxtUrl, "small"), Item::room()});
+    QLayout* tests = inRow(Space::Small, {button(c.Command1, Role::Plain, &UploadForm::Command1_Click),
+                                          button(c.Command5, Role::Plain, &UploadForm::Command5_Click),
+                                          button(c.Command6, Role::Plain, &UploadForm::Command6_Click),
+                                          button(c.Command7, Role::Plain, &UploadForm::Command7_Click),
+                                          button(c.Command8, Role::Plain, &UploadForm::Command8_Click), Item::room()});
+    m_labArea = makeLabPanel({{lists, 3}, {answers, 2}, query, tests, makeReporting()},
+                             button(c.Command9, Role::Main, &UploadForm::Command9_Click));
+    m_labArea->whenEscaped(toPage(&UploadForm::Command9_Click));
+}
+
+void UploadFormView::render() {
+    SendingView::render();
+    m_count->setVisible(c.Pic4Timer.visible);
+    m_count->setValue(c.Picture1Width);
+    m_pause->setVisible(c.Pic4Hamten.visible);
+    m_pause->setValue(c.Pic4HamtenWidth);
+    for (const auto& [shown, text, heading] :
+         {std::tuple(m_answer, &c.TxtWeb, &c.Label4Answer), std::tuple(m_listFile, &c.TxtFromWeb, &c.Label4ListFile)}) {
+        if (shown->toPlainText() != text->text)
+            shown->setPlainText(text->text);
+        speak(shown, heading->text);
+    }
+    m_labArea->setOpen(c.Frame2.visible);
 }
 
 } // namespace lumora

@@ -3,6 +3,8 @@
 #include "transfer/http/UploadForm.h"
 #include "views/sending/SendingView.h"
 
+class QPlainTextEdit;
+
 namespace lumora {
 
 class UploadFormView : public ViewOf<UploadForm, SendingView> {
@@ -11,11 +13,21 @@ public:
     UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override { return m_stop; }
 
+protected:
+    void render() override;
+
 private:
     QLayout* makeSide();
     void makeBars();
+    void makeLabArea();
+    QPlainTextEdit* answer(const Caption& caption);
 
     QPushButton* m_stop = nullptr;
+    QProgressBar* m_count = nullptr;
+    QProgressBar* m_pause = nullptr;
+    QPlainTextEdit* m_answer = nullptr;
+    QPlainTextEdit* m_listFile = nullptr;
+    Overlay* m_labArea = nullptr;
 };
 
 } // namespace lumora
