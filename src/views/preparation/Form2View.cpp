@@ -8,12 +8,20 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+QString fileName(const QString& path) {
+    return fromLeft(LeafName(path));
+}
+
+} // namespace
+
 Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme, page.controls().Label1, page.controls().Label6, page.controls().Label10) {
-    m_removed = listing(c.List4removed, LeafName);
+    m_removed = listing(c.List4removed, fileName);
     m_removed->setMaximumHeight(theme.size(Extent::Drawing));
     add(*trouble().column, {label(c.Label4removed, "strong"), m_removed});
-    m_list = list(c.List1, &Form2::List1_Click, LeafName);
+    m_list = list(c.List1, &Form2::List1_Click, fileName);
     const Card lines = makeCard("card", Pad::Slim);
     m_listCard = lines.frame;
     add(*lines.column, {{m_list, 1}, button(c.Command1, Role::Plain, &Form2::Command1_Click, u"trash"_s)});

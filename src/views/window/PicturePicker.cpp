@@ -65,7 +65,7 @@ public:
                           cell.width() - m_theme.size(Space::Small) * 2, m_theme.px(26));
         const QString name = painter->fontMetrics().elidedText(index.data(Qt::DisplayRole).toString(), Qt::ElideMiddle,
                                                                static_cast<int>(line.width()));
-        painter->drawText(line, Qt::AlignCenter, name);
+        painter->drawText(line, Qt::AlignCenter, fromLeft(name));
         painter->restore();
     }
 
