@@ -127,9 +127,10 @@ Result<void> Program::start() {
     Instances run(dataFolder, reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared);
     if (run.refused()) {
         m_otherCameForward = CallForward(dataFolder);
-        return Failure{Failure::Kind::InUse,
-                       u"%1: the program is already running with this data folder; only one may at a time"_s.arg(
-                           toText(dataFolder))};
+        return Failure{
+            Failure::Kind::InUse,
+            u"%1: the program is already running with this data folder; close its other window first.\n"
+            "\u2067התוכנה כבר פועלת עם תיקיית נתונים זו. יש לסגור קודם את החלון האחר.\u2069"_s.arg(toText(dataFolder))};
     }
     if (!run.another())
         removeLeftovers(dataFolder, startTime);

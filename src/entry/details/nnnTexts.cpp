@@ -127,8 +127,10 @@ bool nnn::asksToMarkLegacy(const HistoryState& history) {
 bool nnn::asksToCleanNotProven(const HistoryState& history) {
     return m_platform.dialogs.ask(
         m_state
-            .wording(u"למחוק גם את קבצי ההדפסה של %1 ההזמנות שלא הוכח שהגיעו?",
-                     u"Delete also the print files of the %1 orders not proven to have arrived?")
+            .wording(u"למחוק גם את קבצי ההדפסה של %1 הזמנות שאינן בשרת בוודאות: שלא הוכח שהגיעו, של התחנה ושיצאו "
+                     u"בדואר? אם לא, הם יישמרו.",
+                     u"Delete also the print files of %1 orders that are not known to be on the server: not proven to "
+                     u"have arrived, of the local station or sent by mail? If not, they are kept.")
             .arg(history.count()));
 }
 
