@@ -60,28 +60,11 @@ TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
     surfaces.Command2_Click();
     EXPECT_EQ(surfaces.controls().Picture2.image().size(), QSize(400, 200));
     EXPECT_EQ(surfaces.controls().Image_crop, QRect(50, 25, 300, 150));
-    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 31);
     EXPECT_EQ(surfaces.controls().List1.item(0), u"020"_s);
     EXPECT_EQ(surfaces.controls().List3.item(surfaces.controls().List3.lastIndex()), u"140"_s);
     EXPECT_NEAR(surfaces.controls().levels.gains[0], 255 / 220.2, 1e-4);
     EXPECT_EQ(surfaces.controls().levels.floors, (ChannelValues{30, 50, 70}));
     EXPECT_EQ(surfaces.workPicture()->workPicture().image(), before);
-
-    surfaces.Command2_Click();
-    EXPECT_EQ(surfaces.controls().List1.count(), 61 * 31) << "the lists start afresh";
-}
-
-TEST_F(WorkSurfaces, TurnGreyWithEqualWeightsOnceAPictureIsThere) {
-    surfaces.Command1_Click();
-    surfaces.Command2_Click();
-    surfaces.Picture1Grey_Click();
-    EXPECT_TRUE(surfaces.controls().List1.isEmpty() && surfaces.controls().Picture1.isNull());
-    surfaces.open(opened(picture("flat.bmp", Bitmap(90, 60, QColor(200, 100, 50)))));
-    surfaces.Command1_Click();
-    EXPECT_EQ(surfaces.workPicture()->workPicture().image().pixelColor(40, 30), QColor(105, 105, 105));
-    surfaces.openSecond(Bitmap(4, 4, Qt::white));
-    surfaces.Picture1Grey_Click();
-    EXPECT_EQ(surfaces.controls().Picture1.image().pixelColor(1, 1), QColor(229, 229, 229));
 }
 
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {

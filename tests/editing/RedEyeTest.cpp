@@ -66,21 +66,5 @@ TEST(RedEye, PassesOverWhatLiesOutsideAndFindsNoPeakWithoutRed) {
     EXPECT_DOUBLE_EQ(peak.ratio(), 0.0);
 }
 
-TEST(RedEye, FixesAroundThePeakOnly) {
-    Bitmap patch(21, 21, QColor(180, 140, 120));
-    for (int y = 8; y <= 12; ++y)
-        for (int x = 8; x <= 12; ++x)
-            patch.image().setPixel(x, y, qRgb(220, 30, 30));
-    const RedEye::PatchStats stats = RedEye::patchStats(patch);
-    EXPECT_EQ(stats.peak.redness, 380);
-    EXPECT_GT(stats.averageRedness, 20.0);
-    RedEye::Peak centre = stats.peak;
-    centre.x = centre.y = 10;
-    RedEye::fixAround(patch, {10, 10}, centre);
-    const int level = RedEye::brightness(qRgb(220, 30, 30));
-    EXPECT_EQ(patch.image().pixel(10, 10), qRgb(level, level, level));
-    EXPECT_EQ(patch.image().pixel(3, 3), qRgb(180, 140, 120));
-}
-
 } // namespace
 } // namespace lumora

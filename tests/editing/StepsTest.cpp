@@ -1,8 +1,6 @@
 // The rules of the editor and of its keyboard, without their pages.
 #include "common/AnsiCodePage.h"
-#include "editing/caption/CaptionStep.h"
 #include "editing/caption/KeyLayout.h"
-#include "editing/editor/LineFrameChoice.h"
 #include "editing/render/PicturePlacement.h"
 #include "editing/render/TextLabelPlace.h"
 #include "order/EditRecord.h"
@@ -23,34 +21,6 @@ TEST(EditStep, StaysWithinTheRangeOfItsButton) {
         {quarterRight(500), 230}, {quarterLeft(230), 500},    {quarterLeft(270), 180}};
     for (const auto& [stepped, expected] : cases)
         EXPECT_EQ(stepped, expected);
-}
-
-TEST(CaptionStep, MovesGrowsAndGoesItsRounds) {
-    EditFields edit;
-    CaptionStep::begin(edit);
-    EXPECT_EQ(qRgb(edit.TextRed, edit.TextGreen, edit.TextBlue), qRgb(255, 255, 30));
-    CaptionStep::move(edit, -2, 4);
-    EXPECT_EQ(QPoint(edit.TextX, edit.TextY), QPoint(98, 104));
-    CaptionStep::move(edit, 32767, -32767 - 200);
-    EXPECT_EQ(QPoint(edit.TextX, edit.TextY), QPoint(32767, -32768));
-    CaptionStep::resize(edit, 2);
-    EXPECT_EQ(edit.TextFontSize, 26);
-    for (const auto& [style, vertical] : {std::pair(1, 3), std::pair(2, 0), std::pair(3, 3), std::pair(0, 0)}) {
-        CaptionStep::nextStyle(edit);
-        CaptionStep::turn(edit);
-        EXPECT_EQ(edit.TextStyle, style);
-        EXPECT_EQ(edit.TextVertical, vertical);
-    }
-}
-
-TEST(LineFrameChoice, StepsThroughTheStylesWithoutTurningRound) {
-    LineFrameChoice choice;
-    EXPECT_FALSE(choice.step(-1)) << "nothing was chosen yet";
-    for (const auto& [steps, code] : {std::pair(3, "W05"), std::pair(30, "W29"), std::pair(-30, "W01")}) {
-        for (int i = 0; i < std::abs(steps); ++i)
-            EXPECT_TRUE(choice.step(steps > 0 ? 1 : -1));
-        EXPECT_EQ(choice.code(), QString::fromLatin1(code));
-    }
 }
 
 TEST(TextLabelPlace, PlacesTheCaptionsBoxAndFindsTheAnchorBack) {
@@ -126,7 +96,7 @@ TEST(PicturePlacement, SizesThePreviewByThePaperCode) {
     }
 }
 
-TEST(PicturePlacement, TakesAPictureFromPreviewToPrint) {
+TEST(PicturePlacement, ReducesThePictureToItsWorkPicture) {
     struct Case {
         PictureSize picture;
         int percent;
@@ -141,24 +111,7 @@ TEST(PicturePlacement, TakesAPictureFromPreviewToPrint) {
     EditFields edit;
     edit.ZoomPercent = 100;
     edit.RotationCode = 180;
-    edit.PanX = 225;
-    edit.PanY = 150;
     EXPECT_EQ(previewPlacement({500, 375}, {450, 300}, edit).zoomed(), (PictureSize{450, 337}));
-    const PrintGeometry tenFifteen = printGeometry({10, 15}, PaperOrientation::Landscape);
-    EXPECT_EQ(tenFifteen.size, (PictureSize{1500, 1000}));
-    const Placement lyingPrint = printPlacement({4000, 3000}, tenFifteen, edit);
-    EXPECT_EQ(lyingPrint.zoomed(), (PictureSize{1500, 1125}));
-    EXPECT_NEAR(lyingPrint.onPaper(0, 0).y, -62, 0.01);
-
-    edit.PanX = 150;
-    edit.PanY = 207;
-    EXPECT_EQ(previewPlacement({375, 500}, {300, 415}, edit).zoomed(), (PictureSize{311, 415}));
-    const PrintGeometry thirteenEighteen = printGeometry({13, 18}, PaperOrientation::Portrait);
-    EXPECT_EQ(thirteenEighteen.size, (PictureSize{1300, 1800}));
-    const Placement uprightPrint = printPlacement({3000, 4000}, thirteenEighteen, edit);
-    EXPECT_EQ(uprightPrint.zoomed(), (PictureSize{1350, 1800}));
-    EXPECT_NEAR(uprightPrint.onPaper(0, 0).x, -25, 0.01);
-    EXPECT_NEAR(uprightPrint.onPaper(0, 0).y, -3, 0.01);
 }
 
 } // namespace

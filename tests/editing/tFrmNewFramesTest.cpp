@@ -11,10 +11,6 @@ TEST_F(TheEditor, putsTheBordersFrameOnAPictureThatHasNone) {
     EXPECT_EQ(field(EditRecord::FrameName), u"001"_s);
     EXPECT_EQ(field(EditRecord::FrameFolder).trimmed(), u"borders"_s);
     EXPECT_GT(corner().green(), 240);
-    editor.Misgerett_Click(false);
-    EXPECT_GT(corner().red(), 240);
-    editor.Misgerett_Click(true);
-    EXPECT_GT(corner().green(), 240);
     editor.Image28_Click();
     EXPECT_GT(corner().red(), 240);
     EXPECT_EQ(stored.last().mid(32, 6), u"999W00"_s);
