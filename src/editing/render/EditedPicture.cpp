@@ -8,6 +8,7 @@
 #include "session/SessionState.h"
 
 #include <QPainter>
+#include <QPolygonF>
 
 #include <algorithm>
 #include <cmath>
@@ -146,11 +147,15 @@ std::optional<Bitmap> loadFrame(const fs::path& framesFolder, const EditFields& 
         auto frame = loadPicture(fileNamed(framesFolder / toHostPath(folder), leaf + u".bmp"_s));
         return frame ? std::optional(*frame) : std::nullopt;
     };
-    if (use == FrameUse::Print) {
-        if (auto frame = load(name))
+    const QString seen = u'k' + name;
+    const QStringList leaves = use == FrameUse::Preview            ? QStringList{seen}
+                               : use == FrameUse::PreviewElsePrint ? QStringList{seen, name}
+                                                                   : QStringList{name, seen};
+    for (const QString& leaf : leaves) {
+        if (auto frame = load(leaf))
             return frame;
     }
-    return load(u'k' + name);
+    return std::nullopt;
 }
 
 Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperSize paper, int zoomPercent, Tone tone,
@@ -170,6 +175,8 @@ Result<EditedPreview> EditedPreview::open(const fs::path& file, PaperSize paper,
     if (!loaded)
         return loaded.failure();
     EditedPreview preview;
+    preview.m_file = *size;
+    preview.m_paper = paper;
     preview.m_box = previewBox(paper, orientationOf(*size));
     preview.m_work = onWhite(*loaded);
     if (sharp != *workSize) {
@@ -191,12 +198,30 @@ void EditedPreview::turnGrey() {
     m_overlay = {};
 }
 
-void EditedPreview::placeAtCentreIfUnset(EditFields& edit) const {
-    constexpr int unset = 781;
-    if (edit.PanX < unset && edit.PanY < unset)
-        return;
-    edit.PanX = static_cast<std::int16_t>(m_box.width / 2);
-    edit.PanY = static_cast<std::int16_t>(m_box.height / 2);
+bool EditedPreview::coversPaper(const EditFields& edit) const {
+    return previewPlacement({m_work.width(), m_work.height()}, m_box, edit).covers(m_box);
+}
+
+bool EditedPreview::touchesPaper(const EditFields& edit) const {
+    const Placement placement = previewPlacement({m_work.width(), m_work.height()}, m_box, edit);
+    const PictureSize size = placement.zoomed();
+    QPolygonF picture;
+    for (const QPoint corner : {QPoint(0, 0), {size.width, 0}, {size.width, size.height}, {0, size.height}}) {
+        const Placement::Point at = placement.onPaper(corner.x(), corner.y());
+        picture += QPointF(at.x, at.y);
+    }
+    // Touching edges share no pixel.
+    return picture.intersects(QPolygonF(QRectF(1, 1, m_box.width - 2, m_box.height - 2)));
+}
+
+std::int16_t EditedPreview::coveringZoom(EditFields edit) const {
+    constexpr std::int16_t largest = 210;
+    const PrintGeometry print = printGeometry(m_paper, orientationOf(m_file));
+    for (; edit.ZoomPercent < largest; ++edit.ZoomPercent) {
+        if (coversPaper(edit) && printPlacement(m_file, print, edit).covers(print.size))
+            return edit.ZoomPercent;
+    }
+    return largest;
 }
 
 void EditedPreview::setBackground(QColor colour) {

@@ -21,11 +21,11 @@ struct EditFields;
 // The share of each channel in the grey that a tone begins with; the three add up to nine tenths.
 inline constexpr float greyWeight = 0.3F;
 
-enum class FrameUse { Preview, Print };
+enum class FrameUse { Preview, PreviewElsePrint, Print };
 
 // The frame of a record out of the folder that holds the categories: "k<name>.bmp" is what the preview shows and
-// "<name>.bmp" what is printed; where the latter can't be loaded, what was seen is printed. No value for "000" and
-// "999", and for names that lead out of that folder.
+// "<name>.bmp" what is printed; where the latter can't be loaded, what was seen is printed. PreviewElsePrint falls back
+// the other way. No value for "000" and "999", and for names that lead out of that folder.
 std::optional<Bitmap> loadFrame(const std::filesystem::path& framesFolder, const EditFields& edit, FrameUse use);
 
 // A picture opened for editing, small enough to be drawn at each tick of a held button.
@@ -44,8 +44,15 @@ public:
     // Turns the work picture grey; twice would darken it twice.
     void turnGrey();
 
-    // A position of 781 or more in either direction is not set; both then become the centre of the box.
-    void placeAtCentreIfUnset(EditFields& edit) const;
+    // As the function below.
+    void placeAtCentreIfUnset(EditFields& edit) const { lumora::placeAtCentreIfUnset(edit, m_box); }
+
+    // True when no part of the paper is bare, and when at least a pixel of the picture lies on it.
+    bool coversPaper(const EditFields& edit) const;
+    bool touchesPaper(const EditFields& edit) const;
+    // The smallest zoom from the record's on with which the picture covers the paper, in the preview and in the print;
+    // 210 where none does.
+    std::int16_t coveringZoom(EditFields edit) const;
 
     // What an uncovered part of the paper shows; without it the whole picture, stretched.
     void setBackground(QColor colour);
@@ -70,6 +77,8 @@ private:
     const Bitmap& sourceFor(double scale) const { return scale > 1 && !m_sharp.isNull() ? m_sharp : m_work; }
     void prepareOverlay(const EditFields& edit, const std::optional<Bitmap>& frame, double scale);
 
+    PictureSize m_file; // the size of the picture itself
+    PaperSize m_paper;
     PictureSize m_box;
     Bitmap m_work;
     Bitmap m_sharp; // the work picture with more pixels, or null

@@ -34,6 +34,17 @@ PictureSize previewBox(PaperSize paper, PaperOrientation orientation) {
     return {300, std::max(1, cut(300.0 * paper.longSide / paper.shortSide))};
 }
 
+bool isPanUnset(const EditFields& edit) {
+    return edit.PanX >= unsetPan || edit.PanY >= unsetPan;
+}
+
+void placeAtCentreIfUnset(EditFields& edit, PictureSize box) {
+    if (!isPanUnset(edit))
+        return;
+    edit.PanX = static_cast<std::int16_t>(box.width / 2);
+    edit.PanY = static_cast<std::int16_t>(box.height / 2);
+}
+
 std::optional<PictureSize> workPictureSize(PictureSize picture, int zoomPercent) {
     const double aspect = double(picture.height) / std::max(1, picture.width);
     const double size = std::min(700.0, zoomPercent * 5.0);

@@ -23,6 +23,11 @@ PaperOrientation orientationOf(PictureSize picture);
 // since positions in the record are in these pixels.
 PictureSize previewBox(PaperSize paper, PaperOrientation orientation);
 
+// The pan of 781 and more of a record is not set; where one of the two is not, both become the centre of the box.
+inline constexpr int unsetPan = 781;
+bool isPanUnset(const EditFields& edit);
+void placeAtCentreIfUnset(EditFields& edit, PictureSize box);
+
 // The work picture that all previews are drawn from: five times the zoom at which it was opened, at most 700, portrait
 // pictures three quarters of that. At least 1 pixel a side; no value for a picture so slim that a side would pass
 // 20,000.
