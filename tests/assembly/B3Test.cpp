@@ -1,7 +1,10 @@
 #include "EditedOrder.h"
 
 #include "editing/render/EditedPicture.h"
+#include "imaging/files/PictureFile.h"
 #include "order/OrderCheck.h"
+
+#include <QPainter>
 
 namespace lumora {
 namespace {
@@ -113,6 +116,47 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
     chain.unload(PageId::FtpFrm);
     state.shemot.ppr = u"zz/zz"_s;
     EXPECT_EQ(prepare({edited(good)}), QStringList(good)) << "no paper";
+}
+
+TEST_F(PreparingAnEditedOrder, carefullyPrintsAPictureThatWasNeverOpenedAsTheEditorWouldShowIt) {
+    // A disc in the middle of a picture that is slimmer than its paper.
+    Bitmap disc(800, 600, Qt::white);
+    QPainter painter(&disc.image());
+    painter.setBrush(Qt::black);
+    painter.drawEllipse(QPoint(400, 300), 150, 150);
+    painter.end();
+    const QString lying = givePicture(u"lying.jpg"_s), upright = givePicture(u"upright.jpg"_s, 30, 40);
+    ASSERT_TRUE(saveJpeg(disc, host(lying), 95));
+    const QString damaged = giveFile(u"damaged.jpg"_s, "no picture");
+    makeFolder(u"C:\\2000lumora\\misgarot\\aa"_s);
+    struct Case {
+        bool careful;
+        const char *border, *record, *lying, *upright; // what becomes of the record's place and of its frame
+    };
+    for (const Case& c :
+         {Case{false, "NB", "new", "999 999 000", "999 999 000"}, Case{true, "NB", "new", "225 150 000", "150 225 000"},
+          Case{true, "NB", "", "225 150 000", "150 225 000"}, Case{true, "WB", "new", "225 150 001", "150 225 001"}}) {
+        SCOPED_TRACE(c.border);
+        state.Careful = c.careful;
+        state.shemot.Bord = QString::fromLatin1(c.border);
+        const QString none = *c.record == 'n' ? EditRecord::newPicture() : QString(200, u' ');
+        EXPECT_EQ(prepare({edited(lying, none), edited(upright, none), edited(damaged, none)}), QStringList(damaged));
+        const QString log = QString::fromLatin1(*machine.files.read(logPath()));
+        const qsizetype line = log.indexOf(u"\"Shoora\",\"1 1015GNB"_s) + 19;
+        const auto shown = [&](qsizetype at) { return log.mid(at + 18, 8) + log.mid(at + 32, 3); };
+        EXPECT_EQ(shown(line), QLatin1String(c.lying));
+        EXPECT_EQ(shown(log.indexOf(u"1 1015GNB"_s, line) + 9), QLatin1String(c.upright));
+        QRect ink;
+        const QImage made = print(0);
+        for (int at = 0; at < made.width() * made.height(); ++at) {
+            if (qGray(made.pixel(at % made.width(), at / made.width())) < 128)
+                ink |= QRect(at % made.width(), at / made.width(), 1, 1);
+        }
+        EXPECT_NEAR(double(ink.width()) / ink.height(), c.careful ? 1 : 1.125, 0.005);
+        chain.unload(PageId::FtpFrm);
+        std::filesystem::remove_all(host(folder()));
+        state.MisparHazmana = u"105"_s;
+    }
 }
 
 TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {

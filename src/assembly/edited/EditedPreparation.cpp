@@ -1,5 +1,6 @@
 #include "assembly/edited/EditedPreparation.h"
 
+#include "assembly/edited/OpenedRecords.h"
 #include "common/FixedText.h"
 #include "imaging/files/BmpFile.h"
 #include "order/EditRecord.h"
@@ -39,7 +40,7 @@ void EditedPreparation::makeJobFolder() const {
 }
 
 bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSize> paper) {
-    begin(lines);
+    begin(OpenedRecords(m_state, m_platform.files, paper).of(lines));
     if (!claimFolder(OrderFolder::Ending::Plain, m_state.transfer.SugSheliach))
         return false;
     keep(kept().keepCorrected(m_lines));
