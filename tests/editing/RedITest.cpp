@@ -145,7 +145,7 @@ TEST_F(RedEyePage, WritesNothingWithoutACorrection) {
     }
 }
 
-TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwnAndTheNextVisitStartsFromTheCustomersFile) {
+TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwn) {
     auto& editor = chain.load<tFrmNew>();
     editor.Command17_Click();
     editor.Image2_Click(7);
@@ -170,13 +170,43 @@ TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwnAndTheNextVisitStartsFromTheCustomers
     EXPECT_EQ(machine.files.read(correctedCopy)->left(2), "BM");
     EXPECT_EQ(pictureIn(correctedCopy), corrected);
     EXPECT_EQ(*machine.files.read(state.edit.PicturePath), customersFile);
+}
 
-    RedI& again = open();
-    EXPECT_EQ(image(again), original);
-    correctAt(again, leftEye);
-    const QImage replaced = image(again);
-    again.Image8_Click();
-    EXPECT_EQ(pictureIn(correctedCopy), replaced);
+TEST_F(RedEyePage, CarefullyGoesOnFromTheCorrectionAndGivesItUpByRestoring) {
+    for (const bool careful : {false, true}) {
+        SCOPED_TRACE(careful);
+        state.Careful = careful;
+        UnpackEditState(EditRecord::newPicture(), state.edit);
+        auto& editor = chain.load<tFrmNew>();
+        editor.Command17_Click();
+        const QImage uncorrected = editor.controls().PicPic.image();
+        RedI& nothing = open();
+        correctAt(nothing, {100, 120}); // skin alone
+        nothing.Image8_Click();
+        EXPECT_EQ(state.edit.RedMarker, careful ? u"000"_s : u"RED"_s);
+        state.edit.RedMarker = u"000"_s;
+
+        RedI& first = open();
+        correctAt(first, leftEye);
+        const QImage corrected = image(first);
+        first.Image8_Click();
+        EXPECT_EQ(editor.controls().PicPic.image() != uncorrected, careful);
+
+        RedI& second = open();
+        EXPECT_EQ(image(second), careful ? corrected : original);
+        EXPECT_EQ(second.controls().Image5.enabled, careful);
+        correctAt(second, rightEye);
+        second.Image8_Click();
+        EXPECT_EQ(pictureIn(correctedCopy).pixel(leftEye) == corrected.pixel(leftEye), careful);
+
+        RedI& third = open();
+        third.Image5_Click();
+        EXPECT_EQ(image(third), original);
+        third.Image8_Click();
+        EXPECT_EQ(state.edit.EditState.mid(38, 3), careful ? u"000"_s : u"RED"_s);
+        EXPECT_EQ(machine.files.fileExists(correctedCopy), !careful);
+        EXPECT_EQ(editor.controls().PicPic.image(), uncorrected);
+    }
 }
 
 TEST_F(RedEyePage, KeepsThePictureBeforeTheLatestCorrectionAsItsUndoCopy) {

@@ -64,7 +64,7 @@ TEST_F(CaptionKeys, aBlankReachesThePictureWithTheNextKey) {
     EXPECT_EQ(keys().Text1.text.size(), 1) << "there is no such key";
 }
 
-TEST_F(CaptionKeys, lettersChangeOnTheirKeysAndTheTextCanBeHidden) {
+TEST_F(CaptionKeys, lettersChangeOnTheirKeys) {
     for (const auto& [press, letter] :
          {std::pair{&mikledet::Command2_Click, u"G"_s}, std::pair{&mikledet::Command9_Click, u"g"_s},
           std::pair{&mikledet::Command4_Click, u"ע"_s}}) {
@@ -74,12 +74,6 @@ TEST_F(CaptionKeys, lettersChangeOnTheirKeysAndTheTextCanBeHidden) {
         page().leter_Click(KeyLayout::firstDigit + 7);
         EXPECT_EQ(state.edit.TextBody, letter + u'7');
     }
-    page().Command8_Click();
-    EXPECT_FALSE(keys().Check4.checked);
-    EXPECT_EQ(kept().TextOn, 0);
-    page().Check4_Click(true);
-    EXPECT_EQ(kept().TextOn, 1);
-    EXPECT_EQ(kept().TextBody, u"ע7"_s) << "its text stays";
 }
 
 TEST_F(CaptionKeys, aHeldButtonStepsByTwoForEachTickAndATapIsOneStep) {
@@ -92,12 +86,6 @@ TEST_F(CaptionKeys, aHeldButtonStepsByTwoForEachTickAndATapIsOneStep) {
         page().tickOnceIfNone();
     }
     EXPECT_EQ(kept().TextFontSize, 24 + 4 + 2);
-    for (const int direction : {0, 0, 1, 2, 3, 3}) {
-        page().Image15_MouseDown(direction);
-        page().tickOnceIfNone();
-        page().Image15_MouseUp();
-    }
-    EXPECT_EQ(QPoint(kept().TextX, kept().TextY), QPoint(98, 102));
     page().Image2_MouseDown();
     chain.show(PageId::tFrmNew);
     page().tickOnceIfNone();
@@ -105,15 +93,17 @@ TEST_F(CaptionKeys, aHeldButtonStepsByTwoForEachTickAndATapIsOneStep) {
 }
 
 TEST_F(CaptionKeys, styleDirectionAlignmentAndColourReachTheRecord) {
-    page().Image3_Click();
-    page().Image4_Click();
+    for (const auto& [style, vertical] : {std::pair(1, 3), std::pair(2, 0), std::pair(3, 3), std::pair(0, 0)}) {
+        page().Image3_Click();
+        page().Image4_Click();
+        EXPECT_EQ(kept().TextStyle, style);
+        EXPECT_EQ(kept().TextVertical, vertical);
+    }
     page().Image5_Click(2);
     page().Image5_Click(3); // there is no fourth
     const QImage& palette = keys().Picture18Image.image();
     page().Picture18_MouseDown(palette.rect().bottomRight());
     page().Picture18_MouseDown({palette.width(), 0}); // outside
-    EXPECT_EQ(kept().TextStyle, 1);
-    EXPECT_EQ(kept().TextVertical, EditRecord::runsDown);
     EXPECT_EQ(kept().TextAlign, 2);
     EXPECT_TRUE(keys().Image5[2].checked);
     EXPECT_EQ(qRgb(kept().TextRed, kept().TextGreen, kept().TextBlue), palette.pixel(palette.rect().bottomRight()));
@@ -129,6 +119,69 @@ TEST_F(CaptionKeys, aRealKeyboardDoesWhatTheKeysDo) {
         page().KeyPress(half);
     EXPECT_EQ(machine.dialogs.messages.size(), 2) << "one for each character that can't be printed";
     EXPECT_EQ(keys().Text1.text, u"Ab \u05F4ש\r\n"_s);
+}
+
+TEST_F(CaptionKeys, aRemovedCaptionIsSeenAsSoonAsItsKeyboardOpensAgain) {
+    for (const bool careful : {false, true}) {
+        SCOPED_TRACE(careful);
+        state.Careful = careful;
+        tFrmNew& editor = open(lying);
+        editor.Command8_Click();
+        page().KeyPress(u'D');
+        state.edit.TextX = 60;
+        state.edit.TextRed = 10;
+        state.edit.TextFontSize = 31;
+        page().Command8_Click();
+        EXPECT_FALSE(keys().Check4.checked);
+        const QImage without = paper();
+        page().CommandDone_Click();
+        editor.Command8_Click();
+        const QImage seen = paper();
+        EXPECT_NE(seen, without);
+        editor.Command11_Click();
+        EXPECT_EQ(paper(), seen);
+        EXPECT_EQ(kept().TextBody, u"D"_s);
+        EXPECT_EQ(QString::number(kept().TextFontSize) + u'/' + QString::number(kept().TextX),
+                  careful ? u"31/60"_s : u"24/100"_s);
+        EXPECT_EQ(kept().TextRed, careful ? 10 : 255);
+    }
+}
+
+TEST_F(CaptionKeys, carefullyKeepsTheCaptionWithinItsColumnsAndTakesALineBreakBackWhole) {
+    for (const bool careful : {false, true}) {
+        SCOPED_TRACE(careful);
+        state.Careful = careful;
+        open(lying).Command8_Click();
+        page().open({}, true);
+        for (const QChar character : u"a\rb\b\b"_s)
+            page().KeyPress(character);
+        EXPECT_EQ(state.edit.TextBody, careful ? u"a"_s : u"a\r"_s);
+        struct Case {
+            int direction;
+            std::int16_t from;
+            int builtIn, careful;
+        };
+        for (const Case& c :
+             {Case{0, -98, -10, -99}, Case{1, 998, 100, 999}, Case{2, -98, -10, -99}, Case{3, 998, 100, 999}}) {
+            state.edit.TextX = state.edit.TextY = c.from;
+            page().Image15_MouseDown(c.direction);
+            page().Timer1_Tick();
+            page().Image15_MouseUp();
+            EXPECT_EQ(c.direction < 2 ? kept().TextX : kept().TextY, careful ? c.careful : c.builtIn);
+        }
+        stored.clear();
+        state.edit.TextFontSize = 94;
+        for (const auto& [press, size] :
+             {std::pair(&mikledet::Image1_MouseDown, careful ? 98 : 10), std::pair(&mikledet::Image2_MouseDown, 8)}) {
+            (page().*press)();
+            for (int i = 0; i < 3; ++i)
+                page().Timer2_Tick();
+            page().Image1_MouseUp();
+            EXPECT_EQ(kept().TextFontSize, size);
+            state.edit.TextFontSize = 12;
+        }
+        EXPECT_EQ(stored.size(), 2) << "once for a hold";
+    }
 }
 
 TEST_F(CaptionKeys, beginsWithTheCaptionOfThePicture) {

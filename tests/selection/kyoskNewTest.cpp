@@ -1,5 +1,6 @@
 #include "selection/pictures/kyoskNew.h"
 
+#include "editing/caption/mikledet.h"
 #include "editing/editor/BigPics.h"
 #include "editing/editor/tFrmNew.h"
 #include "editing/render/StoredSmallView.h"
@@ -155,6 +156,18 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhenTheyAreChosenAnew) {
     state.edit.PicturePath = u"C:\\p\\02.jpg"_path;
     page.Picture1_Click(0);
     EXPECT_EQ(state.edit.ZoomPercent, 130);
+    // A held button of the caption's keyboard changes the line at each step, and writes the files when it is let go.
+    registerPage<mikledet>(PageId::mikledet);
+    editor().Command8_Click();
+    auto& keys = *chain.find<mikledet>();
+    const DrivePath file = u"C:\\2000lumora\\Tik4txt\\all_list.txt"_path;
+    ASSERT_TRUE(machine.files.removeFile(file));
+    keys.Image15_MouseDown(1);
+    keys.Timer1_Tick();
+    EXPECT_EQ(page.controls().List1.item(0).mid(9 + 83, 3), u"102"_s);
+    EXPECT_FALSE(machine.files.fileExists(file));
+    keys.Image15_MouseUp();
+    EXPECT_TRUE(machine.files.fileExists(file));
     EXPECT_EQ(state.edit.TempRedName, u"C;]p]01.jpg"_s);
     EXPECT_EQ(page.controls().List1.item(0).left(9), u"2 1015GNB"_s);
 }

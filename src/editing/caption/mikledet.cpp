@@ -39,7 +39,8 @@ mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& cha
     , m_platform(platform)
     , m_chain(chain)
     , m_timer1(moveMilliseconds, [this] { moveOnce(); })
-    , m_timer2(sizeMilliseconds, [this] { resizeOnce(); }) {
+    , m_timer2(sizeMilliseconds, [this] { resizeOnce(); })
+    , m_guard(state) {
     connect(&chain, &PageChain::shown, this, [this] {
         stopHolding();
         refresh(); // another picture may have been opened since
@@ -123,7 +124,7 @@ void mikledet::typeBlank() {
 void mikledet::takeBack() {
     if (Text1.text.isEmpty())
         return;
-    Text1.text.chop(1);
+    Text1.text.chop(m_guard.lastSign(Text1.text));
     textChanged();
 }
 
@@ -191,14 +192,22 @@ void mikledet::moveOnce() {
     if (!m_held.ticks(m_timer1))
         return;
     CaptionStep::move(m_edit, MoveStepX, MoveStepY);
-    commitText();
+    commitStep();
 }
 
 void mikledet::resizeOnce() {
     if (!m_held.ticks(m_timer2))
         return;
     CaptionStep::resize(m_edit, SizeStep);
-    commitText();
+    commitStep();
+}
+
+void mikledet::endHold() {
+    if (!m_held.isHeld())
+        return;
+    m_held.release();
+    if (auto* editor = m_chain.find<tFrmNew>())
+        editor->keepRecord();
 }
 
 void mikledet::change(void (*step)(EditFields& edit)) {
@@ -239,6 +248,11 @@ void mikledet::textChanged() {
 
 void mikledet::commitText() {
     m_chain.load<tFrmNew>().takeCaption();
+    refresh();
+}
+
+void mikledet::commitStep() {
+    m_chain.load<tFrmNew>().takeCaptionStep();
     refresh();
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "editing/HeldButton.h"
+#include "editing/caption/CaptionGuard.h"
 #include "editing/caption/CaptionStep.h"
 #include "editing/caption/mikledetControls.h"
 #include "session/Page.h"
@@ -62,7 +63,7 @@ public:
     // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
     void tickOnceIfNone() { m_held.tickOnceIfNone(); }
     // The pointer was lost or the page went.
-    void stopHolding() { m_held.release(); }
+    void stopHolding() { endHold(); }
 
     void Image3_Click() { change(CaptionStep::nextStyle); }
     void Image4_Click() { change(CaptionStep::turn); }
@@ -98,12 +99,14 @@ private:
     void takeColour(QPoint at);
     void change(void (*step)(EditFields& edit));
     void commitText();
+    void commitStep();
     void refresh();
     void holdArrow(int direction);
     void holdSize(std::int16_t step);
     void holdMove(std::int16_t x, std::int16_t y);
     void moveOnce();
     void resizeOnce();
+    void endHold();
     void backToEditor();
 
     const SessionState& m_state;
@@ -113,6 +116,7 @@ private:
     Ticker m_timer1;
     Ticker m_timer2;
     HeldButton m_held;
+    const CaptionGuard m_guard;
 };
 
 } // namespace lumora

@@ -32,7 +32,12 @@ tFrmNew::tFrmNew(SessionState& state, const Platform& platform, PageChain& chain
     , Timer3(holdMilliseconds, [this] { brighten(); })
     , Timer6(holdMilliseconds, [this] { turn(); })
     , Timer7(holdMilliseconds, [this] { moveAcross(); })
-    , Timer8(holdMilliseconds, [this] { moveDown(); }) {
+    , Timer8(holdMilliseconds, [this] { moveDown(); })
+    , m_limits(state)
+    , m_coverZoom(state)
+    , m_seenFrame(state)
+    , m_correction(state, platform.files)
+    , m_captionGuard(state) {
     // No button of this page is held once another page is in front.
     connect(&chain, &PageChain::shown, this, &tFrmNew::stopHolds);
 }
@@ -100,6 +105,8 @@ void tFrmNew::OpenPictureInEditor() {
     m_frameKey.clear();
     surfaces().close();
     PicPic = Bitmap();
+    m_coverZoom.forget();
+    Misgerett.checked = m_seenFrame.ticked(Misgerett.checked);
     hidePanels();
 
     ResetEditorZoom();
@@ -113,11 +120,15 @@ void tFrmNew::OpenPictureInEditor() {
         return;
     if (m_edit.AutoMarker == EditRecord::levelled)
         surfaces().measureLevels();
-    if (m_edit.ToneFlag == 1)
-        surfaces().turnGrey();
+    turnGreyIfToned();
     workPicture()->placeAtCentreIfUnset(m_edit);
     putHandle(QPointF(m_edit.PanX, m_edit.PanY));
     packRenderStore();
+}
+
+void tFrmNew::turnGreyIfToned() {
+    if (m_edit.ToneFlag == 1)
+        surfaces().turnGrey();
 }
 
 void tFrmNew::ResetEditorZoom() {
@@ -211,6 +222,7 @@ void tFrmNew::PackEditState() {
     // The handle has no place before a picture is open.
     if (m_open)
         handleToFields();
+    m_limits.hold(m_edit);
     lumora::PackEditState(m_edit, LeftField(m_state.shemot.Bord, 2), Combo4.text);
     Label13.text = m_edit.EditState;
 }
@@ -231,6 +243,7 @@ Bitmap tFrmNew::takeSmallView() {
 }
 
 void tFrmNew::RenderPreview() {
+    m_limits.hold(m_edit);
     PicPic = drawn(m_edit);
     m_drawnSinceTaken = true;
     Q_EMIT changed();
@@ -256,6 +269,14 @@ void tFrmNew::keepRecord() {
     Q_EMIT changed();
 }
 
+void tFrmNew::takeCorrection() {
+    keepRecord();
+    if (!m_open || !m_correction.isSeen() || !loadPictureOfRecord())
+        return;
+    turnGreyIfToned();
+    RenderPreview();
+}
+
 void tFrmNew::undoAllEdits() {
     if (!m_open)
         return;
@@ -267,6 +288,7 @@ void tFrmNew::undoAllEdits() {
         return;
     }
     ColourStep::undo(m_edit);
+    m_coverZoom.forget();
     // The reload may have changed the paper, so the centre is that of the new one.
     putHandle(QPoint(PicPicSize.width / 2, PicPicSize.height / 2));
     handleToFields();

@@ -1,10 +1,15 @@
 #pragma once
 
 #include "editing/HeldButton.h"
+#include "editing/caption/CaptionGuard.h"
 #include "editing/editor/ColourStep.h"
+#include "editing/editor/CoverZoom.h"
 #include "editing/editor/DragHandle.h"
+#include "editing/editor/EditLimits.h"
 #include "editing/editor/LineFrameChoice.h"
+#include "editing/editor/SeenFrame.h"
 #include "editing/editor/tFrmNewControls.h"
+#include "editing/redeye/KeptCorrection.h"
 #include "editing/render/FrameLists.h"
 #include "platform/files/HostPath.h"
 #include "session/Page.h"
@@ -45,9 +50,11 @@ public:
 
     // --- events: by other pages ---
 
-    void openPicture(); // of the session's edit fields
-    void takeCaption(); // the caption's fields were changed: packs, draws, stores, places Labeltext
-    void keepRecord();  // packs and stores
+    void openPicture();     // of the session's edit fields
+    void takeCaption();     // the caption's fields were changed: packs, draws, stores, places Labeltext
+    void takeCaptionStep(); // the same while a button is held: the record is stored by storedMeanwhile()
+    void keepRecord();      // packs and stores
+    void takeCorrection();  // the red-eye page has changed the corrected copy or its mark
     // Ends a held button and a drag as their MouseUp does: the pointer was lost, or the page went.
     void stopHolds();
 
@@ -160,6 +167,8 @@ public:
 Q_SIGNALS:
     // The record of the session is to be kept: the page of pictures listens.
     void stored();
+    // The same of a step that is followed by stored() once the button is let go.
+    void storedMeanwhile();
     // The customer goes back to the pictures.
     void left();
     // The customer picked a picture by its file, to see all pictures of its folder.
@@ -198,9 +207,11 @@ private:
     void moveAcross();
     void moveDown();
     void panBy(QPointF distance);
+    void moveHandle(QPointF to);
     void turnQuarterRight();
     void turnQuarterLeft();
     void turnTo(std::int16_t code);
+    void turnPicture(std::int16_t code);
     void setBarZoom(int percent);
     void beginDrag(QPointF at);
     void drag(QPointF at);
@@ -232,6 +243,7 @@ private:
 
     // The caption.
     void writeCaption();
+    void commitCaption(void (tFrmNew::*store)());
     void beginCaptionDrag(QPointF at);
     void dragCaption(QPointF at);
     void endCaptionDrag();
@@ -247,6 +259,7 @@ private:
     bool loadPictureOfRecord();
     void writeWorkFile();
     void ResetEditorZoom();
+    void turnGreyIfToned();
     void putHandle(QPointF position);
     void handleToFields();
     void PackEditState();
@@ -280,6 +293,11 @@ private:
     QString PaperSizeCode = QStringLiteral("1015");
     std::int16_t PreviewZoom = 100;
     LineFrameChoice m_lineFrame;
+    const EditLimits m_limits;
+    CoverZoom m_coverZoom;
+    const SeenFrame m_seenFrame;
+    const KeptCorrection m_correction;
+    const CaptionGuard m_captionGuard;
 
     // The frame that was drawn last, under its folder and name, so that a tick does not read it again.
     QString m_frameKey;

@@ -1,5 +1,4 @@
 // The editor: the caption, its keyboard and the box by which it is dragged.
-#include "editing/caption/CaptionStep.h"
 #include "editing/caption/mikledet.h"
 #include "editing/editor/tFrmNew.h"
 #include "platform/Platform.h"
@@ -13,8 +12,9 @@ void tFrmNew::writeCaption() {
         return;
     stopHolds();
     if (m_edit.TextOn == 0) {
-        CaptionStep::begin(m_edit);
+        m_captionGuard.begin(m_edit);
         PlaceTextLabel();
+        RenderPreview();
     }
     m_chain.load<mikledet>().open(m_edit.TextBody, m_edit.TextOn == 1);
     m_chain.follow(pageId, Outcome::CaptionWanted);
@@ -22,9 +22,19 @@ void tFrmNew::writeCaption() {
 }
 
 void tFrmNew::takeCaption() {
+    commitCaption(&tFrmNew::stored);
+}
+
+void tFrmNew::takeCaptionStep() {
+    commitCaption(&tFrmNew::storedMeanwhile);
+}
+
+void tFrmNew::commitCaption(void (tFrmNew::*store)()) {
     if (!m_open)
         return;
-    packRenderStore();
+    PackEditState();
+    RenderPreview();
+    Q_EMIT(this->*store)();
     PlaceTextLabel();
     Q_EMIT changed();
 }
@@ -53,6 +63,7 @@ void tFrmNew::dragCaption(QPointF at) {
     const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, meanwhile);
     meanwhile.TextX = static_cast<std::int16_t>(anchor.x());
     meanwhile.TextY = static_cast<std::int16_t>(anchor.y());
+    m_limits.hold(meanwhile);
     PicPic = drawn(meanwhile);
     Q_EMIT changed();
 }

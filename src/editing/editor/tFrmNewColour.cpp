@@ -61,14 +61,14 @@ void tFrmNew::takeTone(Tone tone) {
     hidePanels();
 }
 
-// The picture comes from the customer's file, also where a corrected copy exists. The record keeps its marker, so that
-// the correction is seen again when the picture is opened the next time.
+// As built in, the picture comes from the customer's file, also where a corrected copy exists. The record keeps its
+// marker, so that the correction is seen again when the picture is opened the next time.
 void tFrmNew::backToColour() {
     if (!m_open)
         return;
     stopHolds();
     ResetEditorZoom();
-    if (!LoadWorkBitmap(m_edit.PicturePath))
+    if (!(m_correction.isSeen() ? loadPictureOfRecord() : LoadWorkBitmap(m_edit.PicturePath)))
         return;
     ColourStep::backToColour(m_edit);
     putHandle(QPointF(m_edit.PanX, m_edit.PanY));

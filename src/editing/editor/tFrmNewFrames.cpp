@@ -3,6 +3,7 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/files/PictureFile.h"
 #include "order/EditRecord.h"
+#include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
@@ -55,6 +56,7 @@ void tFrmNew::chooseFrame(int index) {
 void tFrmNew::takeFrame() {
     m_edit.FrameFolder = Combo4.text;
     m_edit.FrameName = Combo2.text;
+    Misgerett.checked = m_seenFrame.ticked(Misgerett.checked);
 }
 
 void tFrmNew::nextFrame() {
@@ -90,8 +92,14 @@ void tFrmNew::removeFrame() {
 
 void tFrmNew::showFrames(bool on) {
     Misgerett.checked = on;
-    if (m_open)
+    if (m_open && !on && m_seenFrame.takeOut(m_edit)) {
+        packRenderStore();
+        m_platform.dialogs.message(m_state.wording(
+            u"המסגרת הוסרה מהתמונה ולא תודפס. כדי להחזיר אותה יש לבחור אותה שוב"_s,
+            u"The frame was taken off the picture and will not be printed. Choose it again to bring it back"_s));
+    } else if (m_open) {
         RenderPreview();
+    }
     Q_EMIT changed();
 }
 
@@ -99,7 +107,7 @@ const std::optional<Bitmap>& tFrmNew::frame(const EditFields& fields) {
     const QString key = Misgerett.checked ? fields.FrameFolder + u'\\' + fields.FrameName : EditRecord::noFrame;
     if (key != m_frameKey) {
         m_frameKey = key;
-        m_frame = Misgerett.checked ? loadFrame(hostOf(WorkspacePaths::misgarot(m_state)), fields, FrameUse::Preview)
+        m_frame = Misgerett.checked ? loadFrame(hostOf(WorkspacePaths::misgarot(m_state)), fields, m_seenFrame.use())
                                     : std::nullopt;
     }
     return m_frame;

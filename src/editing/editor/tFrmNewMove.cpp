@@ -68,6 +68,7 @@ void tFrmNew::zoom() {
     if (!m_held.ticks(Timer2))
         return;
     PreviewZoom = EditStep::zoom(PreviewZoom, m_step);
+    m_coverZoom.forget();
     m_edit.ZoomPercent = PreviewZoom;
     RenderPreview();
     showNumbers();
@@ -87,8 +88,7 @@ void tFrmNew::zoomReleased(Release release) {
 void tFrmNew::turn() {
     if (!m_held.ticks(Timer6))
         return;
-    m_edit.RotationCode = EditStep::turn(m_edit.RotationCode, m_step);
-    showNumbers();
+    turnPicture(EditStep::turn(m_edit.RotationCode, m_step));
     renderPackStore();
 }
 
@@ -103,18 +103,30 @@ void tFrmNew::moveDown() {
 }
 
 void tFrmNew::panBy(QPointF distance) {
-    putHandle(Image3.position() + distance);
+    moveHandle(Image3.position() + distance);
     handleToFields();
     packRenderStore();
 }
 
+void tFrmNew::moveHandle(QPointF to) {
+    putHandle(m_limits.pan(*workPicture(), m_edit, Image3.position(), to));
+}
+
 // --- turning by clicks ---
+
+void tFrmNew::turnPicture(std::int16_t code) {
+    const std::int16_t zoomBefore = m_edit.ZoomPercent;
+    m_coverZoom.turn(m_edit, code, *workPicture());
+    if (m_edit.ZoomPercent != zoomBefore)
+        PreviewZoom = m_edit.ZoomPercent;
+    m_limits.hold(m_edit);
+    showNumbers();
+}
 
 void tFrmNew::turnTo(std::int16_t code) {
     if (!m_open)
         return;
-    m_edit.RotationCode = code;
-    showNumbers();
+    turnPicture(code);
     packRenderStore();
 }
 
@@ -140,8 +152,7 @@ void tFrmNew::drag(QPointF at) {
     hidePanels();
     if (!Image3.held())
         return;
-    Image3.move(at);
-    putHandle(Image3.position());
+    moveHandle(Image3.position() + Image3.distance(at));
     // Only a copy of the fields follows the finger; the record waits until it is lifted.
     EditFields meanwhile = m_edit;
     meanwhile.PanX = HoldIn16Bits(Image3.position().x());

@@ -4,6 +4,9 @@
 
 #include <QPainter>
 
+#include <algorithm>
+#include <utility>
+
 namespace lumora {
 namespace {
 
@@ -13,10 +16,46 @@ void paintOver(Bitmap& picture, QPoint at, const Bitmap& part) {
     painter.drawImage(at, part.image());
 }
 
+// Whether the part of the second picture holds the pixels that stand at a place of the first; both have 32 bits a
+// pixel.
+bool isSame(const QImage& first, QPoint at, const QImage& second, const QRect& part) {
+    for (int y = 0; y < part.height(); ++y) {
+        const auto* a = reinterpret_cast<const QRgb*>(first.constScanLine(at.y() + y)) + at.x();
+        const auto* b = reinterpret_cast<const QRgb*>(second.constScanLine(part.top() + y)) + part.left();
+        if (!std::equal(a, a + part.width(), b, [](QRgb one, QRgb other) { return ((one ^ other) & RGB_MASK) == 0; }))
+            return false;
+    }
+    return true;
+}
+
 } // namespace
 
-void RedEyePicture::begin(Bitmap picture, Bitmap overview, PictureSize overviewSize,
-                          const std::filesystem::path& file) {
+RedEyePicture::Originals RedEyePicture::differences(const Bitmap& file, const Bitmap& picture) {
+    constexpr int side = 64;
+    Originals found;
+    for (int top = 0; top < picture.height(); top += side) {
+        for (int left = 0; left < picture.width(); left += side) {
+            const QRect tile = QRect(left, top, side, side) & picture.image().rect();
+            if (!isSame(file.image(), tile.topLeft(), picture.image(), tile))
+                found.emplace_back(tile.topLeft(), Bitmap(file.image().copy(tile)));
+        }
+    }
+    return found;
+}
+
+bool RedEyePicture::differsFromFile() const {
+    return std::any_of(m_originals.begin(), m_originals.end(), [this](const auto& original) {
+        const QRect part(original.first, original.second.image().size());
+        return !isSame(original.second.image(), {0, 0}, Picture1.image(), part);
+    });
+}
+
+void RedEyePicture::begin(Bitmap picture, Bitmap overview, PictureSize overviewSize, const std::filesystem::path& file,
+                          Originals originals) {
+    m_originals = std::move(originals);
+    for (const auto& [at, original] : m_originals)
+        m_corrected += QRect(at, original.image().size());
+    m_wasCorrected = !m_originals.empty();
     Picture1 = std::move(picture);
     Picture3 = std::move(overview);
     Picture3Size = overviewSize;
@@ -30,7 +69,7 @@ void RedEyePicture::clear() {
     patchPlace = {};
     m_corrected = {};
     m_originals.clear();
-    RedChanged = m_changedBefore = false;
+    RedChanged = m_changedBefore = m_wasCorrected = false;
     RedFixLevel = 0;
 }
 

@@ -23,8 +23,15 @@ namespace lumora {
 // correction.
 class RedEyePicture {
 public:
-    // The customer's picture with its overview. file: where the undo copy goes; empty: nowhere, and keep() fails.
-    void begin(Bitmap picture, Bitmap overview, PictureSize overviewSize, const std::filesystem::path& file);
+    // What the customer's file holds in parts of the picture that do not overlap, each with its place.
+    using Originals = std::vector<std::pair<QPoint, Bitmap>>;
+    // The parts in which a picture of the same size differs from the file.
+    static Originals differences(const Bitmap& file, const Bitmap& picture);
+
+    // The picture with its overview. file: where the undo copy goes; empty: nowhere, and keep() fails. originals: of a
+    // picture that was corrected before.
+    void begin(Bitmap picture, Bitmap overview, PictureSize overviewSize, const std::filesystem::path& file,
+               Originals originals = {});
     void clear();
     // Ends the undo copy; its file stays if it holds a step back.
     void end() { m_undo.end(); }
@@ -47,7 +54,11 @@ public:
 
     bool canGoBack() const { return m_undo.canRestore(); }
     Result<void> goBack();
+    // Brings back the customer's file.
+    bool canCancel() const { return RedChanged || m_wasCorrected; }
     void cancelAll();
+    // Whether a pixel is another one than in the customer's file.
+    bool differsFromFile() const;
 
     // State: const from outside.
     Bitmap Picture1;              // the whole picture at full size: what is edited
@@ -70,9 +81,10 @@ private:
     void afterGoingBack(const QRegion& changedPart);
 
     RedUndoCopy m_undo;
-    bool m_changedBefore = false;                       // RedChanged when the undo copy was made
-    QRegion m_corrected;                                // where Picture1 may differ from the customer's file
-    std::vector<std::pair<QPoint, Bitmap>> m_originals; // what the file holds there
+    bool m_changedBefore = false; // RedChanged when the undo copy was made
+    bool m_wasCorrected = false;  // before this visit
+    QRegion m_corrected;          // where Picture1 may differ from the customer's file
+    Originals m_originals;        // what the file holds there
 };
 
 } // namespace lumora

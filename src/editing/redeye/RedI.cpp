@@ -38,6 +38,7 @@ RedI::RedI(SessionState& state, const Platform& platform, PageChain& chain)
     , m_edit(state.edit)
     , m_platform(platform)
     , m_chain(chain)
+    , m_kept(state, platform.files)
     , Timer1(holdPace, [this] { resizeOnce(); })
     , Timer2(holdPace, [this] { moveCircle(Timer2, 0, -arrowStep); })
     , Timer3(holdPace, [this] { moveCircle(Timer3, 0, arrowStep); })
@@ -72,18 +73,35 @@ void RedI::open(const DrivePath& path) {
         Bitmap picture;
         Bitmap overview;
         PictureSize overviewSize;
+        RedEyePicture::Originals originals;
     };
     const Drives& drives = m_platform.files.drives();
-    const std::optional<HostPath> host = drives.toHost(path);
-    Result<Opened> opened = RunBlocking([&host, &path]() -> Result<Opened> {
-        Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, path.text()};
+    const auto load = [&drives](const DrivePath& from) -> Result<Bitmap> {
+        const std::optional<HostPath> host = drives.toHost(from);
+        Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, from.text()};
+        if (!picture)
+            return picture;
+        Bitmap white = onWhite(*picture);
+        if (white.isNull())
+            return Failure{Failure::Kind::TooLarge, from.text()};
+        return white;
+    };
+    const DrivePath beginning = m_kept.begin(path);
+    Result<Opened> opened = RunBlocking([&]() -> Result<Opened> {
+        Result<Bitmap> picture = load(path);
+        RedEyePicture::Originals originals;
+        if (picture && beginning != path) {
+            const Bitmap file = std::move(*picture);
+            picture = load(beginning);
+            if (picture && picture->image().size() == file.image().size())
+                originals = RedEyePicture::differences(file, *picture);
+            else if (picture)
+                picture = file; // the copy belongs to another picture that had this name
+        }
         if (!picture)
             return picture.failure();
-        const Bitmap white = onWhite(*picture);
-        if (white.isNull())
-            return Failure{Failure::Kind::TooLarge, path.text()};
-        const PictureSize size = RedOverview::size({white.width(), white.height()});
-        return Opened{white, RedOverview::draw(white, RedOverview::pixels(size)), size};
+        const PictureSize size = RedOverview::size({picture->width(), picture->height()});
+        return Opened{*picture, RedOverview::draw(*picture, RedOverview::pixels(size)), size, std::move(originals)};
     });
     endWait();
     if (!opened) {
@@ -98,7 +116,7 @@ void RedI::open(const DrivePath& path) {
     static_cast<void>(Workspace(m_state, m_platform.files).MakeWorkspace());
     const DrivePath undoCopy = WorkspacePaths::tempred(m_state) / u"000.bmp";
     m_picture.begin(std::move(opened->picture), std::move(opened->overview), opened->overviewSize,
-                    drives.toHost(undoCopy).value_or(HostPath()));
+                    drives.toHost(undoCopy).value_or(HostPath()), std::move(opened->originals));
     setTexts();
 }
 
@@ -242,7 +260,13 @@ void RedI::accept() {
     if (!ready())
         return;
     stopHolds();
-    if (m_picture.RedChanged) {
+    switch (m_kept.accept(m_picture)) {
+    case KeptCorrection::Accept::Nothing:
+        break;
+    case KeptCorrection::Accept::GiveUp:
+        giveUpCorrected();
+        break;
+    case KeptCorrection::Accept::Save:
         if (const Result<void> saved = saveCorrected(); !saved) {
             tellFailure(u"התמונה המתוקנת לא נשמרה. התיקונים עדיין כאן.\n%1"_s,
                         u"The corrected picture was not saved. The corrections are still here.\n%1"_s, saved.failure());
@@ -250,7 +274,8 @@ void RedI::accept() {
             return;
         }
         m_edit.RedMarker = EditRecord::corrected;
-        m_chain.load<tFrmNew>().keepRecord();
+        m_chain.load<tFrmNew>().takeCorrection();
+        break;
     }
     close();
 }
@@ -275,6 +300,13 @@ Result<void> RedI::saveCorrected() {
     const Result<void> saved = RunBlocking([this, &host] { return saveBmp(m_picture.Picture1, *host); });
     endWait();
     return saved;
+}
+
+// A copy that can't be removed is read by nobody, since the record has no mark.
+void RedI::giveUpCorrected() {
+    m_edit.RedMarker = EditRecord::notMarked;
+    static_cast<void>(m_platform.files.removeFile(WorkspacePaths::corrected(m_state, DrivePath(caption))));
+    m_chain.load<tFrmNew>().takeCorrection();
 }
 
 void RedI::close() {
@@ -314,7 +346,7 @@ void RedI::showState() {
         control->enabled = able;
     Image6.enabled = Frame6.enabled = ready() && !List1.isEmpty();
     Image7.enabled = ready() && m_picture.canGoBack();
-    Image5.enabled = Rstor.enabled = ready() && m_picture.RedChanged;
+    Image5.enabled = Rstor.enabled = ready() && m_picture.canCancel();
     CommandMenu.enabled = Image8.enabled = Command6.enabled = ready();
     Image9.enabled = !busy;
     CommandCloser.enabled = ready() && m_sight.Magnification < RedEyeSight::largestMagnification;

@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "editing/HeldButton.h"
 #include "editing/editor/DragHandle.h"
+#include "editing/redeye/KeptCorrection.h"
 #include "editing/redeye/RedEyePicture.h"
 #include "editing/redeye/RedEyeSight.h"
 #include "editing/redeye/RedIControls.h"
@@ -24,7 +25,7 @@ class PageChain;
 // of it.
 //
 // The corrected picture goes to a file of its own, which the editor and the print use from then on; the customer's file
-// is opened for reading only, and each visit starts from it again.
+// is opened for reading only; as built in each visit starts from it again.
 class RedI : public Page, private RedIControls {
     Q_OBJECT
 public:
@@ -168,6 +169,7 @@ private:
     void leave();
     void close();
     Result<void> saveCorrected();
+    void giveUpCorrected();
     void waitFor(const QString& text);
     void endWait();
     void tellFailure(const QString& hebrew, const QString& english, const Failure& failure) const;
@@ -186,6 +188,7 @@ private:
     PageChain& m_chain;
     RedEyeSight m_sight;
     RedEyePicture m_picture;
+    const KeptCorrection m_kept;
     int m_sizeStep = 0;
     DragHandle m_drag;
     QPointF m_pressed;                     // where the drag began

@@ -60,6 +60,7 @@ void kyoskNew::load() {
     // This page makes the editor once for each order.
     m_chain.load<tFrmNew>();
     connect(&editor(), &tFrmNew::stored, this, &kyoskNew::storeRecord);
+    connect(&editor(), &tFrmNew::storedMeanwhile, this, &kyoskNew::putRecord);
     connect(&editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);
     connect(&editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
 }

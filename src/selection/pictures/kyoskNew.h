@@ -160,6 +160,7 @@ private:
     void leaveEditor();
     void storeSmallView();
     void storeRecord();
+    int putRecord();
 
     void finish();
     void finishAlbum();

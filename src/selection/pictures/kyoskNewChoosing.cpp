@@ -129,19 +129,26 @@ void kyoskNew::storeSmallView() {
         m_platform.dialogs.message(stored.failure().message);
 }
 
-void kyoskNew::storeRecord() {
+// The index of the basket's line that has the record now, or -1.
+int kyoskNew::putRecord() {
     const QString& path = m_state.edit.PicturePath.text();
     const int index = path.isEmpty() ? -1 : m_choice.storeRecord(path, m_state.edit.EditState);
+    if (index >= 0)
+        showChoice();
+    return index;
+}
+
+void kyoskNew::storeRecord() {
+    const int index = putRecord();
     if (index < 0)
         return;
-    showChoice();
     const Result<void> written = writeHandOverFiles(m_state, m_platform.files, List1.items(), index);
     if (!written && !m_handOverFailed)
         m_platform.dialogs.message(written.failure().message);
     m_handOverFailed = !written;
     // While the editor is in front, the small picture is left until the customer comes back.
     if (m_chain.front() == this)
-        repaint(path);
+        repaint(m_state.edit.PicturePath.text());
 }
 
 } // namespace lumora

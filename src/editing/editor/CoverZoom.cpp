@@ -1,0 +1,22 @@
+#include "editing/editor/CoverZoom.h"
+
+#include "editing/render/EditedPicture.h"
+#include "session/SessionState.h"
+
+#include <utility>
+
+namespace lumora {
+
+void CoverZoom::turn(EditFields& edit, std::int16_t rotationCode, const EditedPreview& picture) {
+    const bool covered = m_state.Careful && (m_own || picture.coversPaper(edit));
+    if (const auto own = std::exchange(m_own, std::nullopt))
+        edit.ZoomPercent = *own;
+    edit.RotationCode = rotationCode;
+    if (!covered)
+        return;
+    const std::int16_t raised = picture.coveringZoom(edit);
+    if (raised != edit.ZoomPercent)
+        m_own = std::exchange(edit.ZoomPercent, raised);
+}
+
+} // namespace lumora
