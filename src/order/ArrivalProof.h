@@ -21,6 +21,9 @@ struct RemoteFile {
 // What proves that an order has arrived: each of its names lies on the server, and each as long as the file here where
 // a length is told. Further names there prove and disprove nothing.
 struct ArrivalProof {
+    // After so many names in a row without a length told a server is not asked for further ones.
+    static constexpr int mostUnanswered = 3;
+
     // FTP takes names as they stand; HTTP servers may change their letter case.
     enum class Names { Exact, WithoutCase };
     // here: names that come twice count once. there: where a name comes twice, the longest length is believed, and an

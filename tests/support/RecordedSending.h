@@ -29,7 +29,7 @@ public:
     void failed(LineStep step, const Failure& failure, const QString& subject) override {
         troubles.push_back({step, failure, subject});
     }
-    void brokenNotKept(const Failure&) override {}
+    void notKept(const Failure&) override {}
     void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) override {
         folders += QStringLiteral("%1 %2 %3").arg(level).arg(asTold, withoutSlash);
     }

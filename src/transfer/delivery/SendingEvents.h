@@ -69,7 +69,8 @@ public:
     virtual void pieceSent(double share, std::optional<int> minutes) = 0;
     // subject: the file's name, if the step is about a file.
     virtual void failed(LineStep step, const Failure& failure, const QString& subject = {}) = 0;
-    virtual void brokenNotKept(const Failure& failure) = 0;
+    // A step of the sending could not be written into the order's folder.
+    virtual void notKept(const Failure& failure) = 0;
     // level: 1 or 2, the lab's folder level that was entered. asTold: the current directory as the server tells it;
     // withoutSlash: the same without its leading slash.
     virtual void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) = 0;

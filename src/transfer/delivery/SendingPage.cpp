@@ -1,9 +1,15 @@
 #include "transfer/delivery/SendingPage.h"
 
+#include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
+#include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "transfer/delivery/CompletenessGuard.h"
+#include "transfer/delivery/OrderFiles.h"
+#include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"
 #include "transfer/report/ReportOnce.h"
 
@@ -162,6 +168,24 @@ void SendingPage::reportAgain() {
 
 void SendingPage::watchReport() {
     report().watch();
+}
+
+void SendingPage::tellNotKept() const {
+    m_platform.dialogs.message(wording(notKeptWords));
+}
+
+bool SendingPage::mayBeSent(const QStringList& paths) const {
+    return CompletenessGuard(m_state, m_platform).maySend(OrderFolder::chosen(m_state), LeafNames(paths));
+}
+
+bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken) {
+    PreparedAgain again(m_state, m_platform, order);
+    const Outcome way = again.way();
+    if (!m_chain.canFollow(id(), way) || !again.isPossible() || !again.handOver(isTaken))
+        return false;
+    m_platform.dialogs.message(wording(numberTakenWords).arg(order.state().number));
+    m_chain.follow(id(), way);
+    return true;
 }
 
 // The order stays in its folder and is listed among the finished ones.

@@ -3,6 +3,7 @@
 #include "session/Page.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/Countdown.h"
+#include "transfer/delivery/PreparedAgain.h"
 #include "transfer/delivery/SendingControls.h"
 #include "transfer/delivery/SendingEvents.h"
 #include "transfer/delivery/SendingPhase.h"
@@ -69,6 +70,13 @@ protected:
     void tellPhase();
     void tellReason(LineStep step, const Failure& failure, const QString& subject);
     void forgetReason();
+    // A step of the sending could not be kept in the order's folder.
+    void tellNotKept() const;
+    // Asked of the files that make up the chosen order; a question's loop may close the page.
+    bool mayBeSent(const QStringList& paths) const;
+    // The order's number is another order's on the server: follows the way to the page that prepares the order again
+    // under another one. False where that is not possible; the page stays.
+    bool prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken);
     const QString& reason() const { return m_reason; } // empty: no failure is to be told
     void tellLab();
     void leaveForNewOrder();

@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-// The phase of a sending, for both senders. Only the FTP sender ends in Unclear or Stopped.
+// The phase of a sending, for both senders. Only the FTP sender ends in Unclear.
 enum class SendingPhase {
     Preparing, // the order is read; the HTTP sender asks which files the server has
     NoOrder,   // the order has no files

@@ -28,4 +28,13 @@ inline constexpr SendingWords reportingAdvice{u"כל ההזמנה הגיעה. מ
 inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
                                             u"The order is kept on this computer. Please call the lab."};
 
+// %1: the number.
+inline constexpr SendingWords numberTakenWords{
+    u"המספר %1 כבר שייך בשרת להזמנה אחרת. ההזמנה תוכן מחדש במספר אחר.",
+    u"Number %1 already belongs to another order on the server. Your order is prepared again under another number."};
+inline constexpr SendingWords notKeptWords{
+    u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה. יש לפנות מקום בדיסק או לתקן את ההרשאות. השליחה נמשכת.",
+    u"How far the sending has come can't be written on this computer. Free some space or mend the rights. The sending "
+    u"goes on."};
+
 } // namespace lumora

@@ -14,9 +14,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// After so many names without an answer a server is not asked again.
-constexpr int mostSilentSizes = 3;
-
 bool isShared(const QString& name) {
     return name == u"000.jpg"_s;
 }
@@ -44,7 +41,7 @@ bool FtpArrival::decides() const {
 }
 
 std::optional<qint64> FtpArrival::ask(FtpConnection& connection, const QString& name) {
-    if (m_unanswered >= mostSilentSizes)
+    if (m_unanswered >= ArrivalProof::mostUnanswered)
         return std::nullopt;
     const Result<std::optional<qint64>> told = connection.length(name);
     const std::optional<qint64> length = told ? *told : std::nullopt;

@@ -131,7 +131,6 @@ private:
     void showCounts();
     void showAttempt(int attempt);
     void showStoppedBoxes();
-    void showNumberTaken(const QString& number);
     void showNoServerBoxes();
 
     // FtpFrmLabTexts.cpp
@@ -146,7 +145,7 @@ private:
     void sending(int index, int count, const QString& name) override;
     void pieceSent(double share, std::optional<int> minutes) override;
     void failed(LineStep step, const Failure& failure, const QString& subject) override;
-    void brokenNotKept(const Failure& failure) override;
+    void notKept(const Failure& failure) override;
     void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) override;
     void pausing(int round) override;
     void status(const QString& text);

@@ -219,8 +219,9 @@ void FtpFrm::failed(LineStep step, const Failure& failure, const QString& subjec
         tellReason(step, failure, subject);
 }
 
-void FtpFrm::brokenNotKept(const Failure& failure) {
-    m_platform.dialogs.message(failure.message);
+void FtpFrm::notKept(const Failure& failure) {
+    m_sender.session.log(u' ' + failure.message);
+    tellNotKept();
 }
 
 void FtpFrm::enteredFolder(int level, const QString& asTold, const QString& withoutSlash) {

@@ -204,14 +204,6 @@ void FtpFrm::showStoppedBoxes() {
                             u"If you do not mean to go on, please tell the shop. Thank you."));
 }
 
-void FtpFrm::showNumberTaken(const QString& number) {
-    m_platform.dialogs.message(
-        wording(u"המספר %1 כבר שייך בשרת להזמנה אחרת. ההזמנה תוכן מחדש במספר אחר.",
-                u"Number %1 already belongs to another order on the server. Your order is prepared again under another "
-                u"number.")
-            .arg(number));
-}
-
 void FtpFrm::showNoServerBoxes() {
     Dialogs& dialogs = m_platform.dialogs;
     dialogs.message(wording(u"המחשב לא מצא שרת זמין\rנסה במועד מאוחר יותר",

@@ -364,7 +364,7 @@ void FtpSession::keepBrokenFiles() {
 
 void FtpSession::keep(const Result<void>& written) {
     if (!written && !std::exchange(m_notKeptTold, true))
-        m_events.brokenNotKept(written.failure());
+        m_events.notKept(written.failure());
 }
 
 void FtpSession::remove(const QString& remoteName) {
