@@ -36,6 +36,8 @@ Result<QByteArray> FakeWebLab::fetch(const QString& url) {
     urls += url;
     if (strikes(deadCalls))
         return down();
+    if (const QByteArray* file = fileAt(url))
+        return *file;
     if (!url.contains(u"listfileb.php"_s)) {
         reports += url;
         if (strikes(deadReports))
@@ -49,22 +51,34 @@ Result<QByteArray> FakeWebLab::fetch(const QString& url) {
     return QByteArray("ok");
 }
 
+const QByteArray* FakeWebLab::fileAt(const QString& url) const {
+    const auto folder = uploads.find(between(url, u"/uploads/"_s, u"/"_s));
+    if (folder == uploads.end())
+        return nullptr;
+    const auto file = folder->second.find(url.mid(url.lastIndexOf(u'/') + 1));
+    return file == folder->second.end() ? nullptr : &file->second;
+}
+
 Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& request) {
     urls += url;
     posts.push_back(request);
     const QString head = AnsiCodePage::decode(request.body.left(400));
     const QString name = between(head, u"filename=\""_s, u"\";"_s);
     posted += name;
+    const int before = aborts;
     if (onPost)
         onPost(name);
     if (strikes(deadPosts))
-        return down();
+        return Failure{deadConnectKind, u"nobody answers"_s};
     const QString folder = between(url, u"folder="_s, u"&"_s);
     const qsizetype from = request.body.indexOf("\r\n\r\n") + 4;
     const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
+    const bool isCut = aborts != before || strikes(cuts[name]);
     uploads[folder];
     if (!strikes(losses[name]))
-        uploads[folder][name] = request.body.mid(from, strikes(halves[name]) ? (end - from) / 2 : end - from);
+        uploads[folder][name] = request.body.mid(from, isCut || strikes(halves[name]) ? (end - from) / 2 : end - from);
+    if (isCut || strikes(lostAnswers[name]))
+        return down();
     return QByteArray("stored");
 }
 
@@ -72,11 +86,8 @@ Result<std::optional<qint64>> FakeWebLab::contentLength(const QString& url) {
     urls += url;
     if (strikes(deadCalls))
         return down();
-    const QString folder = between(url, u"/uploads/"_s, u"/"_s);
-    const QString name = url.mid(url.lastIndexOf(u'/') + 1);
-    if (tellsNoLength || !uploads.contains(folder) || !uploads[folder].contains(name))
-        return std::optional<qint64>();
-    return std::optional<qint64>(uploads[folder][name].size());
+    const QByteArray* file = tellsNoLength ? nullptr : fileAt(url);
+    return file ? std::optional<qint64>(file->size()) : std::nullopt;
 }
 
 Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {

@@ -20,6 +20,8 @@ public:
     int deadReports = 0;                   // the same of calls that are no list
     std::map<QString, int> losses;         // how often a file is accepted and not stored
     std::map<QString, int> halves;         // how often half of a file is stored behind a good answer
+    std::map<QString, int> cuts;           // how often the line is cut in the middle of a file, which is stored
+    std::map<QString, int> lostAnswers;    // how often the line is cut behind the last byte of a file
     bool tellsNoLength = false;            // to HEAD
     std::optional<QByteArray> listInstead; // what each list file says
     bool refusesLists = false;             // no list file is given out
@@ -33,6 +35,8 @@ public:
     QByteArray listOf(const QString& folder) const;
 
 private:
+    const QByteArray* fileAt(const QString& url) const;
+
     std::set<QString> m_listed; // folders whose list was asked for
 };
 

@@ -10,6 +10,8 @@ struct UploadFormRig : SendingRig {
     explicit UploadFormRig(Internet& line)
         : SendingRig(line) {
         state.transfer.SugSheliach = Sender::Http;
+        state.MisparHazmana = u"105"_s;
+        state.Optint = OrderKind::Print;
         ClientProfile& profile = state.profile;
         profile.LabPhone = u"00-0000000"_s;
         profile.HttpHost = u"http://192.0.2.10"_s;

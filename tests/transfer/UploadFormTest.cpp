@@ -6,6 +6,9 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+#include <optional>
+
 namespace lumora {
 namespace {
 
@@ -44,33 +47,37 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
         int posted = 15;       // in all attempts
         LineStep reason = LineStep::Confirm;
         bool done = false;
-        int carefully = 0; // posted in all attempts at an order that arrives with Careful alone
+        int carefully = -1; // posted in all attempts with Careful, where that differs
+        bool carefullyDone = false;
     };
     const Case cases[] = {
         {.fault = "nobody answers",
          .deadPosts = FakeLab::always,
          .deadCalls = FakeLab::always,
-         .reason = LineStep::Put},
-        {.fault = "no line to the list", .deadCalls = FakeLab::always, .reason = LineStep::List},
+         .reason = LineStep::Put,
+         .carefully = 0},
+        {.fault = "no line to the list", .deadCalls = FakeLab::always, .reason = LineStep::List, .carefully = 0},
         {.fault = "four files lost, and no list has their number",
          .lost = {log, first, UploadFormRig::second(), third},
          .posted = 14,
-         .carefully = 9},
+         .carefully = 9,
+         .carefullyDone = true},
         // The load's check takes three calls, that of an attempt three.
         {.fault = "back at the second attempt", .deadPosts = 2, .deadCalls = 3, .posted = 7, .done = true},
         // The two that it still lacks give the number of a list that there is.
         {.fault = "lost once and twice", .lost = {first, first, third}, .posted = 8, .done = true},
         // Nothing has arrived before, and no list has the number of five.
         {.fault = "back at the third attempt",
-         .deadPosts = 10,
-         .deadCalls = 9,
+         .deadPosts = 5,
+         .deadCalls = 6,
          .reason = LineStep::List,
-         .carefully = 15},
+         .carefully = 10,
+         .carefullyDone = true},
     };
     for (const bool careful : {false, true}) {
         for (const auto& c : cases) {
             SCOPED_TRACE(std::string(c.fault) + (careful ? ", careful" : ""));
-            const bool done = c.done || (careful && c.carefully > 0);
+            const bool done = c.done || (careful && c.carefullyDone);
             FakeWebLab faulty;
             UploadFormRig other(faulty);
             other.state.Careful = careful;
@@ -84,14 +91,15 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
             EXPECT_EQ(page.controls().Label1.text, done ? QString() : threeAttempts);
             EXPECT_EQ(faulty.reports.size(), done ? 2 : 0);
             EXPECT_EQ(other.localFiles().size(), 5u);
-            EXPECT_EQ(faulty.posted.size(), careful && c.carefully > 0 ? c.carefully : c.posted);
+            EXPECT_EQ(faulty.posted.size(), careful && c.carefully >= 0 ? c.carefully : c.posted);
             if (done) {
                 EXPECT_EQ(faulty.uploads.at(UploadFormRig::name()), other.localFiles());
                 continue;
             }
             EXPECT_TRUE(page.controls().Label4Reason.visible);
             EXPECT_EQ(page.controls().Label4Reason.text,
-                      LineTroubleText(other.state, c.reason, {}, other.localFiles().rbegin()->first));
+                      LineTroubleText(other.state, careful && c.carefully == 0 ? LineStep::List : c.reason, {},
+                                      other.localFiles().rbegin()->first));
         }
     }
 }
@@ -126,21 +134,47 @@ TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBroke
 }
 
 TEST_F(UploadFormTest, CarefullyAFileArrivesInItsLength) {
+    const QString first = UploadFormRig::first();
+    const QString second = UploadFormRig::second();
     struct Case {
         const char* fault;
-        int halves;
-        bool tellsNoLength;
+        std::function<void(FakeWebLab&)> arrange;
         SendingPhase end;
         int posted;
         bool whole;
-        bool byNameOnly;
+        bool byNameOnly = false;
+        int asked = 1;                                // for the length of the second file
+        SendingPhase builtIn = SendingPhase::Success; // with five posts
+    };
+    using enum SendingPhase;
+    const auto strike = [&](std::map<QString, int> FakeWebLab::*fault, int times, bool tellsLengths) {
+        return [=](FakeWebLab& faulty) {
+            (faulty.*fault)[first] = times;
+            faulty.tellsNoLength = !tellsLengths;
+        };
     };
     const Case cases[] = {
-        {"none", 0, false, SendingPhase::Success, 5, true, false},
-        {"half of a file stored, once", 1, false, SendingPhase::Success, 6, true, false},
-        {"half of a file stored, always", FakeLab::always, false, SendingPhase::NotAll, 7, false, false},
-        {"no HEAD", 0, true, SendingPhase::Success, 5, true, true},
-        {"no HEAD, half of a file stored", 1, true, SendingPhase::Success, 5, false, true},
+        {"none", [](FakeWebLab&) {}, Success, 5, true},
+        {"half of a file stored, once", strike(&FakeWebLab::halves, 1, true), Success, 6, true},
+        {"half of a file stored, always", strike(&FakeWebLab::halves, FakeLab::always, true), NotAll, 7, false},
+        {"no HEAD, half of a file stored", strike(&FakeWebLab::halves, 1, false), Success, 5, false, true},
+        {"cut in the middle", strike(&FakeWebLab::cuts, 1, true), Success, 6, true},
+        {"no HEAD, cut in the middle", strike(&FakeWebLab::cuts, 1, false), Success, 6, true, true},
+        {"an answer lost", strike(&FakeWebLab::lostAnswers, 1, true), Success, 5, true},
+        {"no HEAD, an answer lost", strike(&FakeWebLab::lostAnswers, 1, false), Success, 6, true, true},
+        {"no HEAD, each answer lost", strike(&FakeWebLab::lostAnswers, FakeLab::always, false), NotAll, 7, true, true,
+         0},
+        {"a file that was proven is lost, and half of it stored",
+         [&](FakeWebLab& faulty) {
+             faulty.halves[first] = 1;
+             faulty.onPost = [&](const QString& name) {
+                 if (name == first && faulty.posted.count(first) == 2) {
+                     faulty.uploads[UploadFormRig::name()].erase(second);
+                     faulty.halves[second] = 1;
+                 }
+             };
+         },
+         NotAll, 7, false, false, 2},
     };
     for (const bool careful : {true, false}) {
         for (const auto& c : cases) {
@@ -148,19 +182,150 @@ TEST_F(UploadFormTest, CarefullyAFileArrivesInItsLength) {
             FakeWebLab other;
             UploadFormRig cut(other);
             cut.state.Careful = careful;
-            other.halves[UploadFormRig::first()] = c.halves;
-            other.tellsNoLength = c.tellsNoLength;
-            EXPECT_EQ(cut.send().phase(), careful ? c.end : SendingPhase::Success);
+            c.arrange(other);
+            EXPECT_EQ(cut.send().phase(), careful ? c.end : c.builtIn);
             EXPECT_EQ(other.posted.size(), careful ? c.posted : 5);
-            EXPECT_EQ(other.uploads[UploadFormRig::name()] == cut.localFiles(), careful ? c.whole : c.halves == 0);
-            if (!c.tellsNoLength) {
-                EXPECT_EQ(other.urls.filter(u"/uploads/"_s).filter(UploadFormRig::second()).size(), careful ? 1 : 0)
+            if (careful) {
+                EXPECT_EQ(other.uploads[UploadFormRig::name()] == cut.localFiles(), c.whole);
+                EXPECT_EQ(other.urls.filter(u"/uploads/"_s).filter(second).size(), c.asked)
                     << "a file that is proven is not asked for again";
             }
-            if (c.end == SendingPhase::Success) {
+            if (careful && c.end == Success) {
                 EXPECT_EQ(ReadOrderState(cut.test.files, OrderFolder(UploadFormRig::folder()))->provenByNameOnly,
-                          !careful || c.byNameOnly);
+                          c.byNameOnly);
             }
+        }
+    }
+}
+
+// The folder on the server bears the order's name: whose is it?
+TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
+    const QString log = UploadFormRig::log();
+    struct Case {
+        const char* what;
+        std::optional<FakeLab::Folder> there;
+        bool ours;
+        bool postedInto = false; // by this order, as its state says
+    };
+    const Case cases[] = {
+        {"nothing there", std::nullopt, true},
+        {"an empty folder", FakeLab::Folder(), true},
+        {"its own log, and a stray", FakeLab::Folder{{log, "the order"}, {u"x.jpp"_s, "x"}}, true},
+        {"its own log in capitals", FakeLab::Folder{{log.toUpper(), "the order"}}, true},
+        {"another log", FakeLab::Folder{{log, "no order"}}, false},
+        {"names, and no log", FakeLab::Folder{{UploadFormRig::first(), "another's"}}, false},
+        {"names, and posted into by this order", FakeLab::Folder{{UploadFormRig::first(), "x"}}, true, true},
+    };
+    const QString name = UploadFormRig::name();
+    for (const Case& each : cases) {
+        for (const bool careful : {true, false}) {
+            for (const int free : {107, 0}) { // 0: the basket is gone
+                SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : "") + std::to_string(free));
+                FakeWebLab other;
+                UploadFormRig order(other);
+                order.state.Careful = careful;
+                order.chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+                order.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+                order.write(u"picture.jpg"_s, "a picture of the basket");
+                OrderJournal journal(order.test.files, OrderFolder(UploadFormRig::folder()));
+                ASSERT_TRUE(
+                    journal.begin(order.state, OrderState::Way::Http,
+                                  free ? QStringList(u"021015GNB"_s + UploadFormRig::local(u"picture.jpg"_s).text())
+                                       : QStringList()));
+                ASSERT_TRUE(journal.prepared());
+                if (each.postedInto) {
+                    ASSERT_TRUE(journal.sendingBegins(Sender::Http, true));
+                }
+                if (each.there)
+                    other.uploads[name] = *each.there;
+                other.uploads[u"2026_11_21_KUP_1234^106"_s] = {};
+                const FakeLab::Folder before = other.uploads[name];
+                if (!each.there)
+                    other.uploads.erase(name);
+                UploadForm& page = order.send();
+                if (each.ours || !careful) {
+                    EXPECT_EQ(page.phase(), SendingPhase::Success);
+                    EXPECT_EQ(ReadOrderState(order.test.files, OrderFolder(UploadFormRig::folder()))->folderMadeByUs,
+                              careful || each.postedInto);
+                    continue;
+                }
+                EXPECT_EQ(other.posted, QStringList());
+                EXPECT_EQ(other.uploads[name], before);
+                if (!free) {
+                    EXPECT_EQ(page.phase(), SendingPhase::CallLab);
+                    EXPECT_TRUE(page.controls().Label4Reason.text.contains(u"הזמנה אחרת"_s));
+                    EXPECT_TRUE(page.controls().Label1.text.isEmpty()) << "there were no three attempts";
+                    continue;
+                }
+                EXPECT_EQ(order.chain.front()->id(), PageId::Form2);
+                EXPECT_EQ(order.state.MisparHazmana, QString::number(free));
+                EXPECT_EQ(order.state.handOver.replaced, UploadFormRig::folder());
+                EXPECT_TRUE(order.test.dialogs.messages.value(0).contains(u"105"_s));
+            }
+        }
+    }
+}
+
+TEST_F(UploadFormTest, AStopTakesEffectAtOnceAndTheSendingGoesOnFromThere) {
+    for (const auto phase : {SendingPhase::Preparing, SendingPhase::Sending, SendingPhase::Checking}) {
+        for (const bool inPost : {false, true}) {
+            if (inPost && phase != SendingPhase::Sending)
+                continue;
+            FakeWebLab other;
+            UploadFormRig stopped(other);
+            int pressedAt = 0;
+            const auto press = [&] {
+                if (pressedAt > 0 || !stopped.chain.find(PageId::UploadForm) || stopped.page().phase() != phase)
+                    return;
+                pressedAt = stopped.test.pump.count;
+                stopped.page().Command15_Click();
+            };
+            if (inPost)
+                other.onPost = [&](const QString&) { press(); };
+            else
+                stopped.test.pump.onPump = press;
+            stopped.send();
+            EXPECT_EQ(stopped.page().phase(), SendingPhase::Stopped);
+            EXPECT_EQ(other.aborts, 1);
+            EXPECT_LT(stopped.test.pump.count - pressedAt, 20);
+            EXPECT_EQ(other.reports, QStringList());
+            stopped.page().Command10_Click();
+            stopped.countDown();
+            EXPECT_TRUE(hasArrived(stopped.page().phase()));
+            EXPECT_EQ(other.uploads[UploadFormRig::name()], stopped.localFiles());
+            EXPECT_EQ(other.posted.size(), inPost ? 6 : 5);
+        }
+    }
+}
+
+TEST_F(UploadFormTest, ASilentServerEndsTheSending) {
+    for (const bool careful : {true, false}) {
+        for (const bool standsStill : {true, false}) {
+            FakeWebLab silent;
+            UploadFormRig rigged(silent);
+            rigged.state.Careful = careful;
+            silent.deadConnectKind = Failure::Kind::TimedOut;
+            silent.deadPosts = standsStill ? 0 : FakeLab::always;
+            silent.onPost = [&](const QString&) {
+                for (int i = 0; standsStill && i < 31; ++i) {
+                    rigged.test.clock.time = rigged.test.clock.time.addSecs(10);
+                    rigged.page().Timer4Line_Tick();
+                }
+            };
+            UploadForm& page = rigged.send();
+            EXPECT_EQ(page.phase(), standsStill && !careful ? SendingPhase::Success : SendingPhase::NotAll);
+            EXPECT_EQ(silent.posted.size(), careful ? (standsStill ? 1 : 2) : (standsStill ? 5 : 15));
+            EXPECT_EQ(silent.aborts, careful && standsStill ? 1 : 0);
+            if (!careful)
+                continue;
+            EXPECT_TRUE(page.controls().Label4Reason.text.contains(u"איטי מדי"_s));
+            EXPECT_EQ(page.controls().Label1.text, QString()) << "there were no three attempts";
+            silent.deadPosts = 0;
+            silent.onPost = {};
+            page.Image5_Click();
+            rigged.countDown();
+            EXPECT_EQ(page.phase(), SendingPhase::Success);
+            EXPECT_EQ(silent.uploads[UploadFormRig::name()], rigged.localFiles());
         }
     }
 }
@@ -186,6 +351,8 @@ TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesWithoutBeingReport
     rig.test.dialogs.answers = {true};
     EXPECT_EQ(rig.send().phase(), SendingPhase::AllThere);
     EXPECT_TRUE(arrived());
+    EXPECT_TRUE(rig.page().controls().Label4Do.text.contains(u"3 מתוך 4"_s));
+    EXPECT_FALSE(rig.page().controls().Label4Count.visible) << "not the whole order went up";
     EXPECT_EQ(lab.reports.size(), 0);
     EXPECT_EQ(ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder()))->phase, OrderState::Phase::Sending);
 }

@@ -10,43 +10,36 @@
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/Attempts.h"
-
-#include <optional>
+#include "transfer/delivery/SilenceLimit.h"
+#include "transfer/http/ServerList.h"
 
 namespace lumora {
-
-using namespace Qt::StringLiterals;
-
-namespace {
-
-// After so many names in a row without an answer a server is not asked again in this check.
-constexpr int mostUnanswered = 3;
-
-// In an address these would end the path or begin an escape.
-QString inAddress(const QString& name) {
-    QString encoded = name;
-    return encoded.replace(u"%"_s, u"%25"_s).replace(u"#"_s, u"%23"_s).replace(u"?"_s, u"%3F"_s);
-}
-
-} // namespace
 
 struct HttpArrival::Asked {
     std::optional<qint64> length;
     bool cut = false; // by the line
 };
 
-void HttpArrival::beginOrder() {
+void HttpArrival::beginOrder(const QStringList& inHand) {
+    m_leftBehind = inHand;
     m_proven.clear();
     m_byName = false;
 }
 
-void HttpArrival::forget(const QString& path) {
+void HttpArrival::postBegins(const QString& path) {
     m_proven.remove(path);
 }
 
-bool HttpArrival::isWholeOrder(const OrderFolder& order, const QStringList& names) const {
-    return !m_state.Careful ||
-           OrderCompleteness::read(m_platform.files, order, names).verdict() != OrderCompleteness::Verdict::Fewer;
+void HttpArrival::postCut(const QString& path) {
+    if (m_state.Careful && !m_leftBehind.contains(path))
+        m_leftBehind += path;
+}
+
+std::optional<OrderCompleteness> HttpArrival::lacking(const OrderFolder& order, const QStringList& names) const {
+    if (!m_state.Careful)
+        return std::nullopt;
+    const OrderCompleteness counts = OrderCompleteness::read(m_platform.files, order, names);
+    return counts.verdict() == OrderCompleteness::Verdict::Fewer ? std::optional(counts) : std::nullopt;
 }
 
 bool HttpArrival::byNameOnly() const {
@@ -54,15 +47,17 @@ bool HttpArrival::byNameOnly() const {
 }
 
 // A server that changes the letter case has the file under the name of its list.
-HttpArrival::Asked HttpArrival::ask(const QString& name, const QStringList& entries, const QString& uploads) const {
+HttpArrival::Asked HttpArrival::ask(const QString& name, const Listed& there) const {
     QStringList names{name};
-    for (const QString& entry : entries) {
-        const QString there = entry.trimmed();
-        if (there != name && there.compare(name, Qt::CaseInsensitive) == 0)
-            names += there;
+    for (const QString& entry : there.entries) {
+        const QString listed = entry.trimmed();
+        if (listed != name && listed.compare(name, Qt::CaseInsensitive) == 0)
+            names += listed;
     }
     for (const QString& each : names) {
-        const Result<std::optional<qint64>> told = m_platform.internet.contentLength(uploads + inAddress(each));
+        m_silence.begin();
+        const Result<std::optional<qint64>> told =
+            m_platform.internet.contentLength(there.uploads + NameInAddress(each));
         m_platform.pump.pump();
         if (!told)
             return {{}, true};
@@ -72,22 +67,41 @@ HttpArrival::Asked HttpArrival::ask(const QString& name, const QStringList& entr
     return {};
 }
 
-QStringList HttpArrival::unproven(const QStringList& paths, const QStringList& entries, const QString& uploads) {
+QStringList HttpArrival::remains(const QStringList& paths, const Listed& there) {
+    QStringList left;
+    for (const QString& path : paths) {
+        if (!isLeftBehind(path))
+            continue;
+        const Result<qint64> size = m_platform.files.size(DrivePath(path));
+        const bool asks = m_state.Careful && size && !m_stop.left && !m_stop.StopFlag;
+        if (asks && ask(LeafName(path), there).length == *size) {
+            m_proven[path] = *size;
+            postConfirmed(path);
+        } else {
+            left += path;
+        }
+    }
+    return left;
+}
+
+QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there) {
     if (!m_state.Careful)
         return {};
     QList<LocalFile> here;
-    QList<RemoteFile> there;
+    QList<RemoteFile> told;
     QStringList cut;
     m_byName = false;
     int unanswered = 0;
     int cuts = 0;
+    constexpr int most = ArrivalProof::mostUnanswered;
     for (const QString& path : paths) {
         const Result<qint64> size = m_platform.files.size(DrivePath(path));
         const qint64 length = size ? *size : -1; // a file that is gone here proves nothing by its length
         if (m_proven.contains(path) && m_proven[path] == length)
             continue;
-        const bool asks = unanswered < mostUnanswered && cuts < mostUnanswered && !m_stop.left;
-        const Asked asked = asks ? ask(LeafName(path), entries, uploads) : Asked{{}, cuts > 0};
+        const bool stopped = m_stop.left || m_stop.StopFlag;
+        const bool asks = unanswered < most && cuts < most && !stopped;
+        const Asked asked = asks ? ask(LeafName(path), there) : Asked{{}, cuts > 0 || stopped};
         if (asked.cut) {
             ++cuts;
             cut += path;
@@ -95,11 +109,11 @@ QStringList HttpArrival::unproven(const QStringList& paths, const QStringList& e
         }
         unanswered = asked.length ? 0 : unanswered + 1;
         here += {LeafName(path), length};
-        there += {LeafName(path), asked.length};
+        told += {LeafName(path), asked.length};
         if (asked.length == length)
             m_proven[path] = length;
     }
-    const ArrivalProof proof = ArrivalProof::of(here, there, ArrivalProof::Names::WithoutCase);
+    const ArrivalProof proof = ArrivalProof::of(here, told, ArrivalProof::Names::WithoutCase);
     m_byName = !proof.byName.isEmpty();
     QStringList left = cut;
     for (const QString& path : paths) {

@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/DrivePath.h"
+#include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -22,9 +23,31 @@ namespace {
 constexpr int httpPauseRounds = 1801;
 // A larger file is no list.
 constexpr qint64 largestList = 4 * 1024 * 1024;
+// Numbers that the server is asked for until one is free.
+constexpr int mostNames = 50;
 const QString testFolder = u"tttt"_s;
 
 } // namespace
+
+// While this lives, the customer can stop what runs on the line, and the line is watched.
+class HttpSender::OnLine {
+public:
+    explicit OnLine(HttpSender& sender)
+        : m_sender(sender)
+        , m_line(sender.m_platform) {
+        sender.stop.StopFlag = false;
+        sender.m_silent = false;
+        sender.m_silence.begin();
+        sender.m_onLine = true;
+    }
+    ~OnLine() { m_sender.m_onLine = false; }
+    OnLine(const OnLine&) = delete;
+    OnLine& operator=(const OnLine&) = delete;
+
+private:
+    HttpSender& m_sender;
+    StoppableLine m_line;
+};
 
 HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEvents& events)
     : Attempts(events, stop)
@@ -33,7 +56,9 @@ HttpSender::HttpSender(SessionState& state, const Platform& platform, SendingEve
     , m_platform(platform)
     , m_script(platform)
     , m_listGuard(state)
-    , m_arrival(state, platform, stop) {}
+    , m_silence(state)
+    , m_arrival(state, platform, stop, m_silence)
+    , m_folderOwner(state, platform) {}
 
 QString HttpSender::folderName() const {
     return OrderFolder::chosen(m_state).name();
@@ -41,6 +66,14 @@ QString HttpSender::folderName() const {
 
 QString HttpSender::siteAddress(const QString& rest) const {
     return m_state.profile.HttpHost + u'/' + m_state.profile.HttpTikiya + rest;
+}
+
+QString HttpSender::uploadsAddress() const {
+    return siteAddress(u"/uploads/"_s + folderName() + u'/');
+}
+
+QString HttpSender::listScript(const QString& folder) const {
+    return siteAddress(u"/listfileb.php?tik="_s + folder);
 }
 
 void HttpSender::HttpPause(int times) {
@@ -61,25 +94,55 @@ void HttpSender::BuildOrderFileList() {
         m_journal->isSentAgain();
     report.beginOrder(&*m_journal);
     m_notKeptTold = false;
-    m_arrival.beginOrder();
-    takeLeftBehind();
-}
-
-void HttpSender::takeLeftBehind() {
-    m_leftBehind = m_journal->state().filesInHand;
-    m_leftBehind.removeIf([this](const QString& path) { return !lists.List4Kvazim.contains(path); });
+    m_owner = Owner::NotKnown;
+    m_namesAsked = 0;
+    QStringList inHand = m_journal->state().filesInHand;
+    inHand.removeIf([this](const QString& path) { return !lists.List4Kvazim.contains(path); });
+    m_arrival.beginOrder(inHand);
 }
 
 void HttpSender::keep(const Result<void>& written) {
     if (written || m_notKeptTold)
         return;
     m_notKeptTold = true;
-    m_events.brokenNotKept(written.failure());
+    m_events.notKept(written.failure());
+}
+
+void HttpSender::stopNow() {
+    stop.StopFlag = true;
+    m_platform.internet.abort();
 }
 
 void HttpSender::leave() {
     stop.left = true;
     m_platform.internet.abort();
+}
+
+void HttpSender::watch() {
+    if (!m_onLine || stopped())
+        return;
+    m_silence.moved(m_platform.internet.bytesMoved(), m_platform.clock.now());
+    if (!m_silence.over())
+        return;
+    endSilent();
+    m_platform.internet.abort();
+}
+
+// By the way of a stop, which ends whatever is under way.
+void HttpSender::endSilent() {
+    m_silent = true;
+    stop.StopFlag = true;
+}
+
+std::optional<SendingPhase> HttpSender::earlyEnd() {
+    if (!stop.StopFlag || stop.left)
+        return std::nullopt;
+    stop.StopFlag = false;
+    m_endedEarly = true;
+    if (!m_silent)
+        return SendingPhase::Stopped;
+    m_events.failed(LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
+    return SendingPhase::NotAll;
 }
 
 void HttpSender::tellMissing() {
@@ -89,28 +152,39 @@ void HttpSender::tellMissing() {
 std::optional<SendingPhase> HttpSender::HttpAttempts() {
     m_listNumber = HttpListGuard::first;
     m_listFailure = {};
-    const StoppableLine line(m_platform);
+    m_endedEarly = false;
+    const OnLine line(*this);
     return run(attempts);
 }
 
 std::optional<SendingPhase> HttpSender::sendMissing(int) {
+    m_allPosted = true;
+    if (m_owner == Owner::NotKnown)
+        compare(m_listNumber);
+    // Another attempt could not post either, and would wait as long.
+    if (m_owner == Owner::NotKnown && m_listFailure.kind == Failure::Kind::TimedOut && !stop.StopFlag)
+        endSilent();
+    if (m_owner != Owner::Ours || stopped())
+        return m_owner == Owner::Foreign ? SendingPhase::NumberTaken : earlyEnd();
     const QStringList files = lists.List4Hossarim.items();
     if (m_journal)
-        keep(m_journal->sendingBegins(Sender::Http, false));
+        keep(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
+    m_silence.begin();
     m_left = static_cast<int>(files.size());
-    m_allPosted = true;
     for (int i = 0; i < files.size(); ++i) {
         m_events.sending(i, static_cast<int>(files.size()), LeafName(files[i]));
         HttpPause();
-        if (m_stop.left)
-            return std::nullopt;
+        if (stopped())
+            break;
         post(files[i]);
         m_platform.pump.pump();
         m_events.progressed(i, lists.List4Hossarim.count());
-        if (m_stop.left)
-            return std::nullopt;
+        if (m_silence.over() && !stop.StopFlag)
+            endSilent();
+        if (stopped())
+            break;
     }
-    return std::nullopt;
+    return earlyEnd();
 }
 
 void HttpSender::post(const QString& path) {
@@ -118,33 +192,43 @@ void HttpSender::post(const QString& path) {
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
     if (m_journal)
         keep(m_journal->take(path));
-    m_arrival.forget(path);
+    m_arrival.postBegins(path);
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
-    if (m_journal && (!m_script.failed() || (m_script.failedBeforeSending() && !m_leftBehind.contains(path))))
+    const bool cut = m_script.failed() && !m_script.failedBeforeSending();
+    if (cut)
+        m_arrival.postCut(path);
+    else if (!m_script.failed())
+        m_arrival.postConfirmed(path);
+    if (m_journal && !cut && !m_arrival.isLeftBehind(path))
         keep(m_journal->release(path));
+    m_silence.connectsTimedOut(cut && m_script.lastFailure().kind == Failure::Kind::TimedOut);
     m_events.reached(SendingMoment::Answered);
-    if (m_script.failed()) {
-        m_allPosted = false;
-        if (m_stop.left) // the customer has cut it
-            return;
-        m_events.failed(m_script.failedBeforeSending() ? LineStep::File : LineStep::Put, m_script.lastFailure(),
-                        LeafName(path));
-    } else {
-        m_leftBehind.removeAll(path);
+    if (!m_script.failed()) {
         m_events.reached(SendingMoment::Posted, --m_left);
+        return;
     }
+    m_allPosted = false;
+    if (!stopped())
+        m_events.failed(cut ? LineStep::Put : LineStep::File, m_script.lastFailure(), LeafName(path));
 }
 
 std::optional<SendingPhase> HttpSender::checkArrival(int) {
-    findMissing(m_listNumber);
-    m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
+    const bool posted = m_owner == Owner::Ours;
+    if (posted) {
+        m_silence.begin();
+        compare(m_listNumber);
+        m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
+    }
+    const bool all = posted && lists.List4Hossarim.isEmpty();
+    const std::optional<SendingPhase> early = all ? std::nullopt : earlyEnd();
     // A failed post explains more than the list that lacks the file.
-    if (m_allPosted && !lists.List4Hossarim.isEmpty() && !m_stop.left)
+    if (m_allPosted && !all && !early && !stopped())
         m_events.failed(listTrouble(), m_listFailure);
     m_events.reached(SendingMoment::CheckEnds);
-    if (lists.List4Hossarim.isEmpty())
-        return isWholeOrder() ? SendingPhase::Success : SendingPhase::AllThere;
-    return std::nullopt;
+    if (!all)
+        return early;
+    stop.StopFlag = false;
+    return lacking() ? SendingPhase::AllThere : SendingPhase::Success;
 }
 
 // The step that failed when a check finds files missing although all were posted.
@@ -165,19 +249,33 @@ LineStep HttpSender::listTrouble() const {
     }
 }
 
-void HttpSender::findMissing(int listNumber) {
+std::optional<SendingPhase> HttpSender::findMissing() {
+    m_listFailure = {};
+    m_endedEarly = false;
+    const OnLine line(*this);
+    compare(0);
+    return earlyEnd();
+}
+
+void HttpSender::compare(int listNumber) {
     m_verdict = CheckOrderOnServer(listNumber);
-    if (m_verdict != ServerVerdict::Listed) {
-        lists.List4Hossarim.clear();
-        lists.List4Hossarim.append(lists.List4Kvazim.items());
+    const HttpArrival::Listed there{lists.ListAfterWeb.items(), uploadsAddress()};
+    m_owner = m_journal && !stopped()
+                  ? m_folderOwner.of(*m_journal, ReadServerAnswer(lists.TxtWeb, folderName()), there.uploads)
+                  : Owner::NotKnown;
+    const QStringList order = lists.List4Kvazim.items();
+    QStringList missing = lists.List4Hossarim.items();
+    if (m_verdict == ServerVerdict::Listed && m_owner == Owner::Ours) {
+        QStringList named = order;
+        named.removeIf([&](const QString& path) { return missing.contains(path); });
+        missing += m_arrival.remains(named, there);
+        if (missing.isEmpty())
+            missing = m_arrival.unproven(order, there);
+    } else {
+        missing = order;
     }
-    for (const QString& path : std::as_const(m_leftBehind)) {
-        if (!lists.List4Hossarim.contains(path))
-            lists.List4Hossarim.append(path);
-    }
-    if (lists.List4Hossarim.isEmpty() && !m_stop.left)
-        lists.List4Hossarim.append(m_arrival.unproven(lists.List4Kvazim.items(), lists.ListAfterWeb.items(),
-                                                      siteAddress(u"/uploads/"_s + folderName() + u'/')));
+    lists.List4Hossarim.clear();
+    lists.List4Hossarim.append(missing);
     tellMissing();
 }
 
@@ -194,7 +292,7 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
         DrivePath(lists.List4Kvazim.item(0)).folder().leaf() != name)
         return ServerVerdict::OtherFolder;
     HttpFetchFileListN(listNumber);
-    if (m_stop.left)
+    if (stopped())
         return ServerVerdict::NotVerified;
     readListInOrder();
     const ServerAnswer answer = ReadServerAnswer(lists.TxtWeb, name);
@@ -224,12 +322,12 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
     HttpPause(2);
     lists.TxtFromWeb.clear();
     HttpPause(2);
-    lists.TxtWeb = FetchUrl(siteAddress(u"/listfileb.php?tik="_s + folderName()));
+    lists.TxtWeb = FetchUrl(listScript(folderName()));
     m_events.reached(SendingMoment::Answered);
     HttpPause(3);
     m_platform.pump.pump();
     HttpPause();
-    if (!m_stop.left)
+    if (!stopped())
         downloadList(listNumber);
     m_events.reached(SendingMoment::Answered);
     HttpPause(2);
@@ -243,11 +341,13 @@ void HttpSender::downloadList(int listNumber) {
     const Result<void> cleared = files.fileExists(list) ? files.removeFile(list) : Result<void>();
     if (!cleared)
         m_listFailure = cleared.failure();
-    const QString uploads = siteAddress(u"/uploads/"_s + folderName() + u'/');
-    download.download(uploads + u"filelist1.txt"_s, WorkspacePaths::root(m_state) / u"filelist1.txt");
+    const QString uploads = uploadsAddress();
+    m_silence.begin();
+    download.download(uploads + SecondListName(), WorkspacePaths::root(m_state) / SecondListName());
     HttpPause(2);
     const QString remote = ListFileName(listNumber);
-    if (cleared && !remote.isEmpty()) {
+    if (cleared && !remote.isEmpty() && !stopped()) {
+        m_silence.begin();
         download.download(uploads + remote, list);
         m_listFailure = download.lastFailure();
     }
@@ -260,20 +360,26 @@ void HttpSender::downloadList(int listNumber) {
     }
 }
 
-bool HttpSender::isWholeOrder() const {
-    QStringList names;
-    for (const QString& path : lists.List4Kvazim.items())
-        names += LeafName(path);
-    return m_arrival.isWholeOrder(OrderFolder(m_state.transfer.OrderFolder), names);
+std::optional<OrderCompleteness> HttpSender::lacking() const {
+    return m_arrival.lacking(OrderFolder(m_state.transfer.OrderFolder), LeafNames(lists.List4Kvazim.items()));
+}
+
+std::optional<bool> HttpSender::hasFolder(const QString& name) {
+    if (stopped() || ++m_namesAsked > mostNames)
+        return std::nullopt;
+    const OnLine line(*this);
+    const Result<QByteArray> answer = m_platform.internet.fetch(listScript(name));
+    m_platform.pump.pump();
+    return answer && !stopped() ? std::optional(!TellsUnknownFolder(AnsiCodePage::decode(*answer))) : std::nullopt;
 }
 
 void HttpSender::keepArrival(SendingPhase end) {
-    report.keepArrival(isWholeOrder() ? Arrival::Whole : Arrival::Agreed, end, m_arrival.byNameOnly());
+    report.keepArrival(lacking() ? Arrival::Agreed : Arrival::Whole, end, m_arrival.byNameOnly());
 }
 
 bool HttpSender::keepFoundThere() {
     keepArrival(SendingPhase::Success);
-    const bool due = isWholeOrder() && report.isDueWhereFound();
+    const bool due = !lacking() && report.isDueWhereFound();
     if (!due)
         keepArrival(SendingPhase::AllThere);
     return due;

@@ -3,7 +3,9 @@
 #include "order/OrderJournal.h"
 #include "session/TextList.h"
 #include "transfer/delivery/Attempts.h"
+#include "transfer/delivery/SilenceLimit.h"
 #include "transfer/http/HttpArrival.h"
+#include "transfer/http/HttpFolderOwner.h"
 #include "transfer/http/HttpListGuard.h"
 #include "transfer/http/ServerList.h"
 #include "transfer/http/UploadScript.h"
@@ -16,6 +18,7 @@
 
 namespace lumora {
 
+struct OrderCompleteness;
 struct SessionState;
 
 // The working lists and texts of the HTTP sender, under the names that the lab's people use.
@@ -46,18 +49,32 @@ public:
 
     // Begins an order: fills List4Kvazim with the files of its folder; empty when no folder is set.
     void BuildOrderFileList();
-    // The customer leaves: the call of the line that is under way is cut.
+    // The customer stops, or leaves the page: the call of the line that is under way is cut. A file that was being
+    // posted counts as left behind.
+    void stopNow();
     void leave();
-    // Fills List4Hossarim with the files that the server lacks; with all files when its list can't be trusted.
-    void findMissing(int listNumber);
+    // Called each second: cuts a line that is silent or too slow.
+    void watch();
+    // Fills List4Hossarim with the files that the server lacks; with all files when its list can't be trusted. The end
+    // if the customer has stopped it, or the line was silent.
+    std::optional<SendingPhase> findMissing();
     // Asks the server. listNumber: the list file to download, 0 to 3; none for any other number.
     ServerVerdict CheckOrderOnServer(int listNumber);
     void HttpFetchFileListN(int listNumber);
     // Fills ListInOrder from the list file.
     void readListInOrder();
 
-    // Up to three attempts. The end of the sending; no value when the customer has left.
+    // Up to three attempts. The end of the sending; no value when the customer has left. Nothing is posted into the
+    // folder of another order, nor while it is not known whose it is.
     std::optional<SendingPhase> HttpAttempts();
+    // The last sending ended before its attempts were over; what has arrived meanwhile was not asked.
+    bool endedEarly() const { return m_endedEarly; }
+    // The order's prints, where some that its log names are not among its files.
+    std::optional<OrderCompleteness> lacking() const;
+    // Whether the server has a folder of this name; no value where it does not tell, was asked for too many names or
+    // the customer has stopped it.
+    std::optional<bool> hasFolder(const QString& name);
+    const OrderJournal* journal() const { return m_journal ? &*m_journal : nullptr; }
 
     // The sending has ended so: keeps what has arrived.
     void keepArrival(SendingPhase end);
@@ -87,8 +104,13 @@ private:
     std::optional<SendingPhase> checkArrival(int attempt) override;
     SendingPhase afterTheLast() override { return SendingPhase::NotAll; }
 
-    bool isWholeOrder() const;
-    void takeLeftBehind();
+    class OnLine;
+    using Owner = HttpFolderOwner::Owner;
+
+    void compare(int listNumber);
+    bool stopped() const { return m_stop.left || m_stop.StopFlag; }
+    void endSilent();
+    std::optional<SendingPhase> earlyEnd();
     void keep(const Result<void>& written);
     void post(const QString& path);
     void downloadList(int listNumber);
@@ -96,6 +118,8 @@ private:
     LineStep listTrouble() const;
     QString folderName() const;
     QString siteAddress(const QString& rest) const;
+    QString uploadsAddress() const; // of the order's folder
+    QString listScript(const QString& folder) const;
     QString FetchUrl(const QString& url) const;
 
     SessionState& m_state;
@@ -103,10 +127,15 @@ private:
     UploadScript m_script;
     std::optional<OrderJournal> m_journal;
     bool m_notKeptTold = false; // a step that could not be kept is told once an order
-    // Full paths that an earlier sending had in hand as it ended: half a file may lie on the server under its name.
-    QStringList m_leftBehind;
     HttpListGuard m_listGuard;
+    SilenceLimit m_silence;
     HttpArrival m_arrival;
+    HttpFolderOwner m_folderOwner;
+    Owner m_owner = Owner::NotKnown; // by the last check
+    bool m_onLine = false;           // a sending or a check runs
+    bool m_silent = false;           // the line was cut because nothing moved on it
+    bool m_endedEarly = false;
+    int m_namesAsked = 0; // of folders, for a free number
     int m_listNumber = HttpListGuard::first;
     ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check
     int m_left = 0;                                       // files of the pass not yet posted

@@ -17,6 +17,29 @@ bool namesTotal(const QString& entry) {
     return entry.contains(total, Qt::CaseInsensitive);
 }
 
+bool isServersList(const QString& name) {
+    bool isList = name == SecondListName();
+    for (int number = 0; !isList && !ListFileName(number).isEmpty(); ++number)
+        isList = name == ListFileName(number);
+    return isList;
+}
+
+std::optional<QStringList> filesIn(const QString& answer, const QString& folderName) {
+    QStringList names;
+    bool hasFolder = false;
+    bool hasTotal = false;
+    for (const QString& entry : answer.split(u"~~"_s)) {
+        const QString name = entry.trimmed();
+        if (name == folderName)
+            hasFolder = true;
+        else if (namesTotal(name))
+            hasTotal = true;
+        else if (!name.isEmpty() && !isServersList(name.toLower()))
+            names += name;
+    }
+    return hasFolder && (hasTotal || !names.isEmpty()) ? std::optional(names) : std::nullopt;
+}
+
 } // namespace
 
 QStringList ParseServerList(const QString& text) {
@@ -45,10 +68,17 @@ QStringList MarkHossarim(const QStringList& files, const QStringList& entries, c
     return missing;
 }
 
+bool TellsUnknownFolder(const QString& answer) {
+    return answer.contains(u"not"_s, Qt::CaseInsensitive);
+}
+
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {
     ServerAnswer read;
-    if (answer.contains(u"not"_s, Qt::CaseInsensitive))
+    if (TellsUnknownFolder(answer)) {
+        read.files.emplace();
         return read;
+    }
+    read.files = filesIn(answer, folderName);
     read.entries = ParseServerList(answer);
     read.namesFolder = std::any_of(read.entries.begin(), read.entries.end(),
                                    [&](const QString& entry) { return entry.trimmed() == folderName; });
@@ -61,6 +91,15 @@ QString ListFileName(int number) {
     if (number < 0 || number > 3)
         return {};
     return number == 0 ? u"filelisthom.txt"_s : u"filelisthom%1.txt"_s.arg(number);
+}
+
+QString SecondListName() {
+    return u"filelist1.txt"_s;
+}
+
+QString NameInAddress(const QString& name) {
+    QString encoded = name;
+    return encoded.replace(u"%"_s, u"%25"_s).replace(u"#"_s, u"%23"_s).replace(u"?"_s, u"%3F"_s);
 }
 
 } // namespace lumora

@@ -3,6 +3,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <optional>
+
 namespace lumora {
 
 // The entries of a listing by the lab's scripts: names separated by "~~", among them the folder's name and "total:"
@@ -31,10 +33,19 @@ struct ServerAnswer {
     ServerVerdict verdict = ServerVerdict::NotVerified; // Listed: the list names the folder and has a total
     QStringList entries;                                // empty when the folder is unknown to the server
     bool namesFolder = false;                           // with or without a total, whose number is not compared
+    // Names in the folder but for the server's own lists; empty where there is no folder. No value: the answer does
+    // not tell. A text that is too short to be a listing tells of an empty folder.
+    std::optional<QStringList> files;
 };
+bool TellsUnknownFolder(const QString& answer);
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName);
 
 // The name of the server's list file 0 to 3; empty for any other number.
 QString ListFileName(int number);
+// The second list file, which is kept beside the orders.
+QString SecondListName();
+
+// A leaf name as it stands in an address: "%", "#" and "?" would end its path or begin an escape.
+QString NameInAddress(const QString& name);
 
 } // namespace lumora

@@ -1,12 +1,9 @@
 #include "transfer/http/UploadForm.h"
 
-#include "common/DrivePath.h"
 #include "order/OrderFolder.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
-#include "transfer/delivery/CompletenessGuard.h"
-#include "transfer/delivery/StoppableLine.h"
 
 #include <algorithm>
 
@@ -29,6 +26,7 @@ UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain&
     : SendingPage(PageId::UploadForm, state, platform, chain, *this, Countdown(httpCountFrom, httpCountEnd))
     , Timer1(panelTick, [this] { growPanel(); })
     , Timer2(httpSecond, [this] { countSecond(); })
+    , Timer4Line(httpSecond, [this] { m_sender.watch(); })
     , m_sender(state, platform, *this) {
     showAnswers();
 }
@@ -38,6 +36,7 @@ void UploadForm::load() {
 }
 
 void UploadForm::begin() {
+    Timer4Line.start();
     refreshList();
 }
 
@@ -48,6 +47,7 @@ bool UploadForm::idle() const {
 void UploadForm::leave() {
     m_sender.leave();
     stopTimers();
+    Timer4Line.stop();
 }
 
 void UploadForm::stopTimers() {
@@ -69,9 +69,15 @@ void UploadForm::refreshList() {
     stopTimers();
     Picture6.visible = false;
     m_sender.BuildOrderFileList();
+    m_sender.stop.StopFlag = false;
+    m_busy = true;
     Q_EMIT changed();
     m_platform.pump.pump();
-    findMissing();
+    m_busy = false;
+    if (m_sender.stop.StopFlag && !m_sender.stop.left)
+        enter(SendingPhase::Stopped);
+    else
+        findMissing();
 }
 
 void UploadForm::findMissing() {
@@ -86,21 +92,25 @@ void UploadForm::findMissing() {
         enter(SendingPhase::NoServer);
         return;
     }
-    if (!mayBeSent()) {
-        m_refused = true;
-        if (!m_sender.stop.left)
-            enter(SendingPhase::NoOrder);
+    const bool mayGo = mayBeSent(lists().List4Kvazim.items());
+    if (m_sender.stop.left)
+        return;
+    m_refused = !mayGo;
+    if (!mayGo) {
+        enter(SendingPhase::NoOrder);
         return;
     }
     m_busy = true;
+    forgetReason();
     enter(SendingPhase::Preparing);
-    {
-        const StoppableLine line(m_platform);
-        m_sender.findMissing(0);
-    }
+    const std::optional<SendingPhase> end = m_sender.findMissing();
     m_busy = false;
     if (m_sender.stop.left)
         return;
+    if (end) {
+        enter(*end);
+        return;
+    }
     if (!lists().List4Hossarim.isEmpty()) {
         startPanel();
         return;
@@ -112,13 +122,6 @@ void UploadForm::findMissing() {
         return;
     }
     endAllThere();
-}
-
-bool UploadForm::mayBeSent() {
-    QStringList names;
-    for (const QString& path : lists().List4Kvazim.items())
-        names += LeafName(path);
-    return CompletenessGuard(m_state, m_platform).maySend(OrderFolder::chosen(m_state), names) && !m_sender.stop.left;
 }
 
 void UploadForm::growPanel() {
@@ -155,6 +158,11 @@ void UploadForm::countSecond() {
     sendMissing();
 }
 
+void UploadForm::stopSending() {
+    if ((m_busy && phase() == SendingPhase::Preparing) || isUnderWay(phase()))
+        m_sender.stopNow();
+}
+
 void UploadForm::stopCount() {
     if (!idle() || phase() != SendingPhase::Countdown)
         return;
@@ -166,10 +174,16 @@ void UploadForm::stopCount() {
 void UploadForm::goOn() {
     if (idle() && phase() == SendingPhase::Waiting)
         startPanel();
+    else if (phase() == SendingPhase::Stopped)
+        refreshList(); // the server is asked for what has arrived until the stop
 }
 
 void UploadForm::sendAgain() {
-    if (idle() && phase() == SendingPhase::NotAll)
+    if (phase() != SendingPhase::NotAll)
+        return;
+    if (m_sender.endedEarly())
+        refreshList();
+    else
         sendMissing();
 }
 
@@ -178,31 +192,53 @@ void UploadForm::sendMissing() {
         return;
     stopTimers();
     Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
-    Command15.enabled = true;
     forgetReason();
     const std::optional<SendingPhase> end = m_sender.HttpAttempts();
     if (!end)
         return;
-    Command15.enabled = false;
     Label4File.text.clear();
-    if (*end == SendingPhase::Success) {
+    switch (*end) {
+    case SendingPhase::Success:
         succeed();
         return;
-    }
-    if (*end == SendingPhase::AllThere) {
+    case SendingPhase::AllThere:
         m_sender.keepArrival(*end);
         endAllThere();
         return;
+    case SendingPhase::NumberTaken:
+        prepareAgain();
+        return;
+    default:
+        endIncomplete(*end);
     }
-    m_attemptFailed = true;
-    Label1.text = wording(u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
-                          u"After three attempts the computer could not upload the whole order");
-    enter(*end);
+}
+
+void UploadForm::endIncomplete(SendingPhase end) {
+    const bool afterTheLast = end == SendingPhase::NotAll && !m_sender.endedEarly();
+    m_attemptFailed = afterTheLast;
+    Label1.text = afterTheLast ? wording(u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
+                                         u"After three attempts the computer could not upload the whole order")
+                               : QString();
+    Label9.visible = Pic4Hamten.visible = false;
+    enter(end);
+}
+
+void UploadForm::prepareAgain() {
+    const auto isTaken = [this](const QString& name) { return m_sender.hasFolder(name); };
+    if (SendingPage::prepareAgain(*m_sender.journal(), isTaken) || m_sender.stop.left)
+        return;
+    if (m_sender.stop.StopFlag) {
+        endIncomplete(SendingPhase::Stopped);
+        return;
+    }
+    tellReason(LineStep::ForeignFolder, {Failure::Kind::InUse, m_orderName}, {});
+    endIncomplete(SendingPhase::CallLab);
 }
 
 void UploadForm::endAllThere() {
     Label1.text.clear();
     m_attemptFailed = false;
+    m_lacking = m_sender.lacking();
     forgetReason();
     Picture1.visible = true;
     enter(SendingPhase::AllThere);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/OrderCompleteness.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/SendingPage.h"
 #include "transfer/http/HttpSender.h"
@@ -23,10 +24,12 @@ public:
     // Events.
     void Timer1_Tick() { growPanel(); }
     void Timer2_Tick() { countSecond(); }
+    void Timer4Line_Tick() { m_sender.watch(); }
     void Command2_Click() { refreshList(); }
     void Command4_Click() { findMissing(); }
     void Command3_Click() { stopCount(); }
     void Command10_Click() { goOn(); }
+    void Command15_Click() { stopSending(); }
     void Command28_Click() { leaveForAnother(); }
     void Image5_Click() { sendAgain(); }
     void Image3_Click() { leaveProgram(); }
@@ -59,13 +62,15 @@ private:
     void startPanel();
     void refreshList();
     void findMissing();
-    bool mayBeSent();
     void stopCount();
+    void stopSending();
     void goOn();
     void sendAgain();
     void sendMissing();
     void succeed();
     void endAllThere();
+    void endIncomplete(SendingPhase end);
+    void prepareAgain();
     void leaveForAnother();
 
     // UploadFormTexts.cpp
@@ -96,18 +101,20 @@ private:
     void sending(int index, int count, const QString& name) override;
     void pieceSent(double, std::optional<int>) override {}
     void failed(LineStep step, const Failure& failure, const QString& subject) override;
-    void brokenNotKept(const Failure& failure) override;
+    void notKept(const Failure& failure) override;
     void enteredFolder(int, const QString&, const QString&) override {}
     void pausing(int round) override;
 
-    Ticker Timer1; // 1 ms: the panel grows
-    Ticker Timer2; // 1000 ms: the countdown
+    Ticker Timer1;     // 1 ms: the panel grows
+    Ticker Timer2;     // 1000 ms: the countdown
+    Ticker Timer4Line; // 1000 ms: the watch over the line
     HttpSender m_sender;
-    bool m_refused = false;       // the customer or a guard did not let the order leave
-    bool m_busy = false;          // a check outside an attempt runs
-    bool m_attemptFailed = false; // an attempt of this sending has left files behind
-    std::optional<int> m_left;    // files that have not arrived, once they are counted
-    QString m_orderName;          // as the server was asked for it
+    bool m_refused = false;                     // the customer or a guard did not let the order leave
+    bool m_busy = false;                        // a check outside an attempt runs
+    bool m_attemptFailed = false;               // an attempt of this sending has left files behind
+    std::optional<int> m_left;                  // files that have not arrived, once they are counted
+    std::optional<OrderCompleteness> m_lacking; // of an order that has arrived with fewer prints than its log names
+    QString m_orderName;                        // as the server was asked for it
 };
 
 } // namespace lumora

@@ -27,7 +27,7 @@ struct UploadFormControls : SendingControls {
     Caption Command2{*this, u"Command2", Caption::At::Hidden};   // refresh
     Caption Command3{*this, u"Command3", Caption::At::Hidden};   // stop
     Caption Command10{*this, u"Command10", Caption::At::Hidden}; // continue
-    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // enabled during a sending; has no handler
+    Caption Command15{*this, u"Command15", Caption::At::Greyed}; // stop, enabled during a sending
     Caption endClose{*this, u"endClose", Caption::At::Hidden};   // close, at the end
 
     Caption Label1{*this, u"Label1"};                                // number of the attempt

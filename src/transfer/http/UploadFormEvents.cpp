@@ -1,7 +1,5 @@
 // Shows the events of a sending by HTTP in the page's controls and words.
 #include "order/OrderFolder.h"
-#include "platform/Dialogs.h"
-#include "platform/Platform.h"
 #include "session/SessionState.h"
 #include "transfer/http/UploadForm.h"
 
@@ -74,8 +72,8 @@ void UploadForm::failed(LineStep step, const Failure& failure, const QString& su
     showTrouble();
 }
 
-void UploadForm::brokenNotKept(const Failure& failure) {
-    m_platform.dialogs.message(failure.message);
+void UploadForm::notKept(const Failure&) {
+    tellNotKept();
 }
 
 void UploadForm::pausing(int round) {

@@ -3,6 +3,7 @@
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/http/UploadForm.h"
 
+#include <algorithm>
 #include <array>
 
 namespace lumora {
@@ -14,11 +15,16 @@ namespace {
 constexpr SendingWords allWentUp{u"הזמנה זו עלתה במלואה", u"This order went up in full"};
 constexpr SendingWords startsIn{u" המשלוח יחל בעוד ", u"The sending starts in"};
 constexpr SendingWords secondsWord{u"שניות", u"seconds"};
+constexpr SendingWords stoppedTitle{u"המשלוח נעצר", u"The sending is stopped"};
+// %1: prints among the files, %2: prints that the log names.
+constexpr SendingWords fewerArrived{
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",
+    u"%1 of the %2 pictures in the order's log have arrived, and the lab was not told. Please call the lab."};
 constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "};
 
 } // namespace
 
-// The page never enters Stopped or Unclear.
+// The page never enters Unclear.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
     constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
@@ -27,7 +33,7 @@ std::span<const PhaseLook> UploadForm::looks() const {
         PhaseLook{SendingPhase::Preparing,
                   SendingSign::Asking,
                   None,
-                  {},
+                  {Stop},
                   sendingTitle,
                   {u"קוראים את ההזמנה ובודקים מה כבר הגיע לשרת. נא להמתין.",
                    u"Reading the order and checking what is on the server already. Please wait."}},
@@ -48,12 +54,20 @@ std::span<const PhaseLook> UploadForm::looks() const {
                   SendingSign::Held,
                   GoOn,
                   {GoOn, NewOrder, Refresh},
-                  {u"המשלוח נעצר", u"The sending is stopped"},
+                  stoppedTitle,
                   {u"המשלוח נעצר. כדי לשלוח יש ללחוץ על הלחצן המשך את המשלוח.",
                    u"The sending is stopped. Press Continue the sending to send."}},
-        PhaseLook{SendingPhase::Sending, SendingSign::Percent, None, {}, sendingTitle, sendingAdvice},
-        PhaseLook{SendingPhase::Checking, SendingSign::Asking, None, {}, sendingTitle, checkingAdvice},
-        PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {}, sendingTitle, reportingAdvice},
+        PhaseLook{SendingPhase::Stopped,
+                  SendingSign::Held,
+                  GoOn,
+                  {GoOn, NewOrder, Refresh},
+                  stoppedTitle,
+                  {u"ההזמנה שמורה במחשב זה. כדי להמשיך יש ללחוץ על הלחצן המשך את המשלוח. מה שכבר הגיע לא יישלח שוב.",
+                   u"The order is kept on this computer. Press Continue the sending to go on. What has arrived is not "
+                   u"sent again."}},
+        PhaseLook{SendingPhase::Sending, SendingSign::Percent, None, {Stop}, sendingTitle, sendingAdvice},
+        PhaseLook{SendingPhase::Checking, SendingSign::Asking, None, {Stop}, sendingTitle, checkingAdvice},
+        PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {Stop}, sendingTitle, reportingAdvice},
         PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
         PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
         PhaseLook{
@@ -70,6 +84,10 @@ std::span<const PhaseLook> UploadForm::looks() const {
 }
 
 QString UploadForm::advice(const PhaseLook& row) const {
+    if (row.phase == SendingPhase::AllThere && m_lacking)
+        return wording(fewerArrived)
+            .arg(std::min(m_lacking->present, m_lacking->marked))
+            .arg(m_lacking->named.value_or(0));
     return wording(row.phase == SendingPhase::NoOrder && m_refused ? refusedAdvice : row.advice);
 }
 
@@ -78,9 +96,10 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Image5.visible = row.buttons.testFlag(SendAgain);
     Command2.visible = row.buttons.testFlag(Refresh);
     Command3.visible = row.buttons.testFlag(Hold);
+    Command15.enabled = row.buttons.testFlag(Stop);
     Command10.visible = row.buttons.testFlag(GoOn);
     endClose.visible = row.buttons.testFlag(Close);
-    Label11.visible = row.phase == SendingPhase::AllThere;
+    Label11.visible = row.phase == SendingPhase::AllThere && !m_lacking;
     if (!isUnderWay(row.phase) && row.phase != SendingPhase::Preparing)
         Pic4Hamten.visible = false;
     showCount();
@@ -94,7 +113,7 @@ void UploadForm::showCount() {
     const bool counts = phase() == SendingPhase::Countdown;
     const QString seconds = QString::number(countdown().seconds());
     Label8.text = seconds;
-    Label4Count.visible = counts || phase() == SendingPhase::AllThere;
+    Label4Count.visible = counts || (phase() == SendingPhase::AllThere && !m_lacking);
     Label4Count.text =
         counts ? wording(startsIn).trimmed() + u' ' + seconds + u' ' + wording(secondsWord) : wording(allWentUp);
 }
