@@ -26,7 +26,7 @@ UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain&
     : SendingPage(PageId::UploadForm, state, platform, chain, *this, Countdown(httpCountFrom, httpCountEnd))
     , Timer1(panelTick, [this] { growPanel(); })
     , Timer2(httpSecond, [this] { countSecond(); })
-    , Timer4Line(httpSecond, [this] { m_sender.watch(); })
+    , Timer4Line(httpSecond, [this] { watchLine(); })
     , m_sender(state, platform, *this) {
     showAnswers();
 }

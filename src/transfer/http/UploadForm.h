@@ -24,7 +24,7 @@ public:
     // Events.
     void Timer1_Tick() { growPanel(); }
     void Timer2_Tick() { countSecond(); }
-    void Timer4Line_Tick() { m_sender.watch(); }
+    void Timer4Line_Tick() { watchLine(); }
     void Command2_Click() { refreshList(); }
     void Command4_Click() { findMissing(); }
     void Command3_Click() { stopCount(); }
@@ -62,6 +62,7 @@ private:
     void startPanel();
     void refreshList();
     void findMissing();
+    void watchLine() { m_sender.watch(); }
     void stopCount();
     void stopSending();
     void goOn();
