@@ -176,12 +176,10 @@ bool Preparation::writeLog(OrderLog::Layout layout) {
     return true;
 }
 
-// The replaced order's number belongs to another order on the server; where a picture has failed, the replaced order
-// may hold its only print. A station's order is never made again.
-void Preparation::removeWhatIsNotNeeded() const {
+// A station's order is never made again.
+void Preparation::removeWhatIsNotNeeded() {
     const Files& files = m_platform.files;
-    if (m_failed.isEmpty() && !m_replaced.isEmpty() && files.folderExists(m_replaced) && m_replaced != m_folder->path())
-        static_cast<void>(files.removeTree(m_replaced)); // the next start tries again
+    static_cast<void>(RemoveReplacedOrder(files, *m_journal)); // the next start tries again
     const DrivePath kept = m_folder->keptWorkPath();
     if (m_journal->state().way == OrderState::Way::Station && files.folderExists(kept))
         static_cast<void>(files.removeTree(kept)); // hidden, and never sent

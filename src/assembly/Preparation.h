@@ -92,7 +92,7 @@ private:
     Result<void> readyFolder(OrderFolder::Ending ending);
     void findPrints();
     void removePrints() const;
-    void removeWhatIsNotNeeded() const;
+    void removeWhatIsNotNeeded();
 
     std::optional<OrderJournal> m_journal; // of m_folder
     QStringList m_failed;                  // paths of the pictures that could not be prepared

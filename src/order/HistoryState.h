@@ -24,7 +24,7 @@ struct HistoryState {
     QList<OrderFolder> notProven; // made for a server, and not proven to have arrived there
     QList<OrderFolder> legacy;    // of these, the finished ones of an earlier version, which kept no state
     QList<OrderFolder> station;   // of the local station
-    QList<OrderFolder> mail;      // walked out by mail
+    QList<OrderFolder> mail;      // sent by mail
 
     static HistoryState of(const SessionState& state, const Files& files);
 

@@ -124,6 +124,11 @@ Result<void> OrderJournal::release(const QString& path) {
     return keep(next);
 }
 
+void OrderJournal::countFiles(int sent, int inAll) {
+    m_state.filesSent = sent;
+    m_state.filesInAll = inAll;
+}
+
 Result<void> OrderJournal::arrived(bool byNameOnly) {
     makeKnown();
     OrderState next = m_state;
@@ -165,6 +170,12 @@ Result<void> OrderJournal::needsNoReport() {
     makeKnown();
     OrderState next = m_state;
     next.phase = Phase::Reported;
+    return keep(next);
+}
+
+Result<void> OrderJournal::replacesNone() {
+    OrderState next = m_state;
+    next.replaces.clear();
     return keep(next);
 }
 

@@ -43,6 +43,8 @@ public:
     // A file's full path, before its put and after the put that was confirmed.
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);
+    // How far the sending has come; kept with the next step.
+    void countFiles(int sent, int inAll);
     // All files of the order lie on the server, none is in hand any more.
     Result<void> arrived(bool byNameOnly);
     // All files of the folder lie there. The log names more, and the customer has agreed to that.
@@ -53,6 +55,8 @@ public:
     // The order has arrived and the lab wants no report.
     Result<void> needsNoReport();
     Result<void> wentByMail();
+    // The order that this one was prepared again from is gone, or is one of its own.
+    Result<void> replacesNone();
 
 private:
     void makeKnown();

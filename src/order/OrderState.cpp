@@ -99,6 +99,10 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.serial = value;
     else if (key == u"Optint")
         state.kind = static_cast<OrderKind>(Val16(value));
+    else if (key == u"FilesSent")
+        state.filesSent = value.toInt();
+    else if (key == u"FilesInAll")
+        state.filesInAll = value.toInt();
     else if (key == u"Replaces")
         state.replaces = value;
     else if (key == u"InHand")
@@ -134,6 +138,10 @@ QByteArray OrderState::write() const {
         writer.truth("SentBefore", true);
     writer.truth("ProvenByNameOnly", provenByNameOnly);
     writer.word("Report", reports, report);
+    if (phase == Phase::Sending && filesInAll > 0) {
+        writer.text(u"FilesSent"_s, QString::number(filesSent));
+        writer.text(u"FilesInAll"_s, QString::number(filesInAll));
+    }
     for (const QString& path : filesInHand)
         writer.text(u"InHand"_s, path);
     if (!replaces.isEmpty())

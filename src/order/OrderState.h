@@ -37,6 +37,8 @@ struct OrderState {
     bool fewerAgreed = false;      // all files of its folder arrived; the customer agreed that the log names more
     bool sentBefore = false;       // first known by a resend; an older version has sent it
     bool provenByNameOnly = false; // the server told no lengths
+    int filesSent = 0;             // of a whole sending: answered well or found there, before the file in hand
+    int filesInAll = 0;            // 0: not counted
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;
     QString replaces;               // folder name of the order that this one was prepared again from

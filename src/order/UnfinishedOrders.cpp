@@ -7,16 +7,17 @@
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
+#include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
 #include "order/PrintFile.h"
 #include "order/PrintFileName.h"
+#include "platform/files/EmptyFolder.h"
 #include "platform/files/Files.h"
+#include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-
-#include <unistd.h>
 
 #include <algorithm>
 #include <utility>
@@ -29,12 +30,6 @@ using Phase = OrderState::Phase;
 using Way = OrderState::Way;
 
 namespace {
-
-// The system removes a folder in this way only if it holds nothing, hidden files included.
-void removeIfEmpty(const Files& files, const DrivePath& folder) {
-    if (const Result<HostPath> host = files.host(folder))
-        static_cast<void>(::rmdir(host->c_str()));
-}
 
 // A corrected copy is there also where only the order has kept it.
 bool pictureIsThere(const BasketLine& line, LineForm form, const SessionState& state, const Files& files,
@@ -50,7 +45,6 @@ bool isGone(const QString& item, LineForm form, const SessionState& state, const
     return !HasQuestionMark(item) && !pictureIsThere(BasketLine::split(item, form), form, state, files, folder);
 }
 
-// The replaced order may hold the only prints of what could not be prepared again.
 bool hasFailed(const Files& files, const OrderFolder& folder) {
     OrderLog log;
     const Result<QByteArray> bytes = files.read(folder.logPath());
@@ -68,10 +62,11 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
     const OrderState& state = order.state;
     if (state.phase == Phase::Preparing)
         return !state.items.isEmpty();
-    if (state.phase < Phase::Arrived && (state.fewerAgreed || state.sentBefore))
+    if (state.phase == Phase::Reported || !canBeSent(session, state))
         return false;
-    if (state.phase == Phase::Reported || !canBeSent(session, state) ||
-        (state.phase == Phase::Arrived && state.report != OrderState::Report::NotYet))
+    if (state.phase == Phase::Arrived)
+        return state.report == OrderState::Report::NotYet;
+    if (state.fewerAgreed || state.sentBefore)
         return false;
     const QStringList names = files.names(order.folder.path(), u"*"_s);
     return OrderCompleteness::read(files, order.folder, names).verdict() != OrderCompleteness::Verdict::None;
@@ -121,15 +116,38 @@ void tidyOrders(const SessionState& state, const Files& files) {
         if (const DrivePath fromServer = folder.fetchedLogPath(); files.fileExists(fromServer))
             static_cast<void>(files.removeFile(fromServer));
         removeIfEmpty(files, folder.path());
-        const Result<OrderState> order = ReadOrderState(files, folder);
-        if (!order || order->phase == Phase::Preparing || order->replaces == name || !names.contains(order->replaces))
-            continue;
-        // Of the replaced order nothing was sent; one that a later sending has taken up is none any more.
-        const DrivePath replaced = orders / order->replaces;
-        const Result<OrderState> before = ReadOrderState(files, OrderFolder(replaced));
-        if (before && before->phase <= Phase::Prepared && !hasFailed(files, folder))
-            static_cast<void>(files.removeTree(replaced));
+        OrderJournal order(files, folder);
+        static_cast<void>(RemoveReplacedOrder(files, order)); // the next start tries again
     }
+}
+
+Result<void> RemoveReplacedOrder(const Files& files, OrderJournal& order) {
+    const QString name = order.state().replaces;
+    if (!order.known() || order.state().phase == Phase::Preparing || name.isEmpty())
+        return {};
+    const OrderFolder replaced(order.folder().path().folder() / name);
+    const Result<OrderState> before = ReadOrderState(files, replaced);
+    if (before && before->phase <= Phase::Prepared && name != order.folder().name()) {
+        if (hasFailed(files, order.folder()))
+            return {};
+        if (Result<void> removed = files.removeTree(replaced.path()); !removed)
+            return removed;
+    }
+    return order.replacesNone();
+}
+
+std::optional<OrderFolder> ReplacementOf(const SessionState& state, const Files& files, const OrderFolder& folder) {
+    const Result<OrderState> replaced = ReadOrderState(files, folder);
+    if (!replaced || replaced->phase > Phase::Prepared)
+        return std::nullopt;
+    const DrivePath orders = WorkspacePaths::orders(state);
+    for (const QString& name : files.folders(orders)) {
+        const OrderFolder other(orders / name);
+        const Result<OrderState> order = ReadOrderState(files, other);
+        if (order && order->replaces == folder.name() && name != folder.name())
+            return other;
+    }
+    return std::nullopt;
 }
 
 DrivePath KeptWorkFolder(const OrderFolder& folder, const DrivePath& scratch) {
@@ -206,6 +224,16 @@ Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Fil
     }
     takeUpSending(order, state, files);
     return order.state.way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp;
+}
+
+bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const Files& files, PageChain& chain,
+                   PageId from) {
+    const SessionState before = state;
+    const Outcome way = takeUpOrder(order, state, files);
+    if (chain.canFollow(from, way) && chain.follow(from, way))
+        return true;
+    state = before;
+    return false;
 }
 
 Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder) {

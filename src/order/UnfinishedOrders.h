@@ -8,14 +8,18 @@
 
 #include <QList>
 
+#include <optional>
+
 namespace lumora {
 
 class Files;
+class OrderJournal;
+class PageChain;
 struct SessionState;
 
-// Takes away what a kill has left among the orders: orders that were prepared again under another number, folders that
-// were claimed and hold nothing, and the copies of logs that came from a server. Only for a data folder in which no
-// other program runs, since another's claimed folder is empty too.
+// Removes what a killed program has left among the orders: orders that were prepared again under another number,
+// claimed folders that hold nothing, and logs that were fetched from a server. Only for a data folder in which no other
+// program runs: a folder that another program has just claimed is empty too.
 void tidyOrders(const SessionState& state, const Files& files);
 
 // An order whose preparation or sending did not come to its end.
@@ -25,6 +29,9 @@ struct UnfinishedOrder {
     int pictures = 0; // lines of the basket with a usable name
     int prepared = 0; // of these, the ones whose print is there
     int gone = 0;     // of the others, the ones whose picture is no longer there
+
+    // Without any picture there is no order to go on with.
+    bool lacksAllPictures() const { return gone > 0 && gone == pictures; }
 };
 
 // The order as its folder and its state tell it; pictures are counted while it is being prepared.
@@ -39,6 +46,16 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
 
 // Sets the session for going on with the order, and tells the way to the page that does it.
 Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files);
+// Does so and follows that way. False where it leads nowhere; the session is as before then.
+bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const Files& files, PageChain& chain,
+                   PageId from);
+
+// The order that was prepared again from this one, whose number is another order's on the server. None where this one
+// was sent after all.
+std::optional<OrderFolder> ReplacementOf(const SessionState& state, const Files& files, const OrderFolder& folder);
+// Removes the order that this one was prepared again from, once this one is whole. One that was sent meanwhile is an
+// order of its own; one stays while a picture of this order has failed, since it may hold the only print.
+Result<void> RemoveReplacedOrder(const Files& files, OrderJournal& order);
 
 // Removes the order's folder with all that it holds.
 Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder);

@@ -48,6 +48,8 @@ TEST_F(AJournal, keepsEachStepAndWritesNothingWhereNothingChanges) {
          },
          Phase::Preparing, 0, Report::NotYet, 2},
         {"prepared", [](OrderJournal& journal) { return journal.prepared(); }, Phase::Prepared, 0, Report::NotYet, 2},
+        {"folder asked for", [](OrderJournal& journal) { return journal.folderIsAsked(); }, Phase::Prepared, 0,
+         Report::NotYet, 2},
         {"sending", [](OrderJournal& journal) { return journal.sendingBegins(Sender::Http, true); }, Phase::Sending, 0,
          Report::NotYet, 0},
         {"take", [](OrderJournal& journal) { return journal.take(printPath); }, Phase::Sending, 1, Report::NotYet, 0},
@@ -71,6 +73,7 @@ TEST_F(AJournal, keepsEachStepAndWritesNothingWhereNothingChanges) {
         EXPECT_EQ(state.report, step.report) << step.what;
         EXPECT_EQ(state.items.size(), step.lines) << step.what;
         EXPECT_EQ(state.number + state.serial + state.replaces, u"1051234old"_s) << step.what;
+        EXPECT_EQ(state.makesFolder, &step == &steps[2]) << step.what;
         EXPECT_EQ(state.folderMadeByUs, step.phase >= Phase::Sending) << step.what;
         EXPECT_EQ(state.way, step.phase >= Phase::Sending ? Way::Http : Way::Station) << step.what;
         ASSERT_TRUE(test.files.removeFile(folder.filePath(u".order"_s)));

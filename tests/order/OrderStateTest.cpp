@@ -65,7 +65,9 @@ TEST(AnOrderState, keepsEachStepOfTheSendingAndDropsTheBasketWhenItBegins) {
         OrderState state = unfinished();
         state.phase = phase;
         state.way = OrderState::Way::Station;
-        state.folderMadeByUs = state.provenByNameOnly = true;
+        state.folderMadeByUs = state.provenByNameOnly = state.makesFolder = state.fewerAgreed = state.sentBefore = true;
+        if (phase == Phase::Sending)
+            state.filesSent = 3, state.filesInAll = 7;
         state.filesInHand = {u"C:\\a.jpp"_s, u"C:\\ב.jpp"_s};
         state.replaces = u"2026_11_21_KUP_1234^104"_s;
         state.report = OrderState::Report::Begun;

@@ -93,6 +93,11 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
               QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name, "2026_11_21_KUP_1234^106",
                            lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
     EXPECT_FALSE(test.files.fileExists(orders / u"2026_11_21_KUP_1234^102" / u".log-there"));
+    EXPECT_EQ(ReadOrderState(test.files, anew)->replaces, QString()) << "its number may come again";
+    EXPECT_EQ(ReplacementOf(session, test.files, OrderFolder(orders / name))->name(), u"2026_11_21_KUP_1234^106");
+    give(name, inPhase(Phase::Sending));
+    EXPECT_FALSE(ReplacementOf(session, test.files, OrderFolder(orders / name))) << "it was sent after all";
+    give(name, inPhase(Phase::Prepared));
     EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^108", "2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104"}))
         << "the replaced one waits";
 }
@@ -104,6 +109,7 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         Report report;
         bool withPrint;
         bool offered;
+        bool OrderState::*flag = nullptr;
     } cases[] = {
         {Phase::Preparing, Way::Ftp, Report::NotYet, false, true},
         {Phase::Preparing, Way::Station, Report::NotYet, true, true},
@@ -113,7 +119,9 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         {Phase::Prepared, Way::Ftp, Report::NotYet, false, false}, // its print files were cleaned away
         {Phase::Sending, Way::Mail, Report::NotYet, true, false},
         {Phase::Sending, Way::Ftp, Report::NotYet, true, true},
-        {Phase::Arrived, Way::Http, Report::NotYet, true, true},
+        {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::fewerAgreed},
+        {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::sentBefore},
+        {Phase::Arrived, Way::Http, Report::NotYet, false, true}, // the lab alone is to be told
         {Phase::Arrived, Way::Ftp, Report::Begun, true, false},
         {Phase::Reported, Way::Ftp, Report::Done, true, false},
     };
@@ -121,6 +129,8 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         OrderState state = inPhase(c.phase);
         state.way = c.way;
         state.report = c.report;
+        if (c.flag)
+            state.*c.flag = true;
         const OrderFolder folder = give(name, state, c.withPrint ? QStringList(print) : QStringList());
         EXPECT_EQ(offered(), c.offered ? QStringList(name) : QStringList()) << (&c - cases);
         ASSERT_TRUE(throwAwayOrder(test.files, folder));

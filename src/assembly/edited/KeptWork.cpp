@@ -44,7 +44,8 @@ void KeptWork::bringBack() const {
     for (const DrivePath& scratch : {WorkspacePaths::tempred(m_state), WorkspacePaths::jobFolder(m_state)}) {
         const DrivePath kept = KeptWorkFolder(m_folder, scratch);
         for (const QString& name : m_files.names(kept, u"*"_s))
-            static_cast<void>(m_files.keepCopy(kept / name, scratch / name)); // the picture then fails by its name
+            static_cast<void>(
+                m_files.keepCopy(kept / name, scratch / name)); // a picture that is missing here fails, and is named
     }
 }
 

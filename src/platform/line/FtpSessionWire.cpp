@@ -478,7 +478,9 @@ Result<FtpListing> FtpSessionWire::list(const QString& pattern, EmptyFolder empt
         empty == EmptyFolder::MayBeRefused && listing.isEmpty() && (m_transferCode == 450 || m_transferCode == 550);
     if (!received && !refusedAsEmpty)
         return received.failure();
-    return ParseFtpListing(listing);
+    FtpListing read = ParseFtpListing(listing);
+    read.refused = !received;
+    return read;
 }
 
 Result<std::optional<qint64>> FtpSessionWire::length(const QString& remoteName) {

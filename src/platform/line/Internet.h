@@ -27,6 +27,7 @@ struct FtpEntry {
 // The answer to a listing.
 struct FtpListing {
     std::vector<FtpEntry> entries; // in the server's order, "." and ".." as they come
+    bool refused = false;          // LIST was refused with 450 or 550: empty, or not to be read
     QString unread; // the first line that could not be read; with one, a name that is missing proves nothing
 };
 
