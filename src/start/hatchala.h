@@ -166,6 +166,8 @@ private:
     void goOnWithOrder();
     void putOffOrder();
     void throwOrderAway();
+    bool asksToThrowAway(const QString& number);
+    QString offerText(const UnfinishedOrder& order) const;
 
     void setEnglish(bool english);
     void showHelp(Hover over);

@@ -26,17 +26,14 @@ void hatchala::goOnWithOrder() {
     // Pictures may have gone or come back, with their card, since the panel opened.
     UnfinishedOrder& order = m_unfinished.first();
     order = UnfinishedOrderOf(m_state, m_platform.files, order.folder, order.state);
-    if (order.gone > 0 && (!m_asksForGone || order.gone == order.pictures)) {
+    if (order.gone > 0 && (!m_asksForGone || order.lacksAllPictures())) {
         m_asksForGone = true;
         showOffer();
         return;
     }
-    const SessionState before = m_state;
-    if (m_chain.follow(PageId::hatchala, takeUpOrder(order, m_state, m_platform.files))) {
+    if (GoOnWithOrder(order, m_state, m_platform.files, m_chain, PageId::hatchala)) {
         m_leaving = true;
         stopTimers();
-    } else {
-        m_state = before;
     }
 }
 
@@ -55,11 +52,7 @@ void hatchala::throwOrderAway() {
     if (m_leaving || !Pic4Hemshech.visible)
         return;
     const UnfinishedOrder order = m_unfinished.first();
-    if (!m_platform.dialogs.ask(m_state
-                                    .wording(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
-                                             u"Throw order number %1 away? It can't be brought back.")
-                                    .arg(order.state.number)) ||
-        m_leaving)
+    if (!asksToThrowAway(order.state.number) || m_leaving)
         return;
     if (const Result<void> gone = throwAwayOrder(m_platform.files, order.folder); !gone)
         m_platform.dialogs.message(gone.failure().message);

@@ -1,4 +1,5 @@
 // The wording of the start page, in both languages.
+#include "platform/Dialogs.h"
 #include "session/CaptionTexts.h"
 #include "session/SessionState.h"
 #include "start/hatchala.h"
@@ -66,36 +67,60 @@ void hatchala::showOffer() {
     if (m_unfinished.isEmpty())
         return;
     const UnfinishedOrder& order = m_unfinished.first();
-    // Without any picture there is no order to go on with.
-    Command4Hemshech.enabled = !m_asksForGone || order.gone < order.pictures;
+    Command4Hemshech.enabled = !m_asksForGone || !order.lacksAllPictures();
     setCaptions(m_state, {
                              {Command4Hemshech, m_asksForGone ? u"המשך בלעדיהן" : u"המשך",
                               m_asksForGone ? u"Go on without them" : u"Go on"},
                              {Command4Achar, m_asksForGone ? u"המתן" : u"אחר כך", m_asksForGone ? u"Wait" : u"Later"},
                          });
-    if (m_asksForGone)
-        Label4Hemshech.text =
-            m_state.wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
-                .arg(order.gone)
-                .arg(order.pictures);
-    else if (order.state.phase == OrderState::Phase::Preparing)
-        Label4Hemshech.text = m_state
-                                  .wording(u"הזמנה מספר %1: הוכנו %2 מתוך %3 תמונות.",
-                                           u"Order number %1: %2 of %3 pictures are prepared.")
-                                  .arg(order.state.number)
-                                  .arg(order.prepared)
-                                  .arg(order.pictures);
-    else if (order.state.phase == OrderState::Phase::Prepared)
-        Label4Hemshech.text =
-            m_state.wording(u"הזמנה מספר %1 מוכנה ועדיין לא נשלחה.", u"Order number %1 is ready and was not sent.")
-                .arg(order.state.number);
-    else
-        Label4Hemshech.text =
-            m_state.wording(u"השליחה של הזמנה מספר %1 לא הושלמה.", u"The sending of order number %1 was not finished.")
-                .arg(order.state.number);
+    Label4Hemshech.text = offerText(order);
     Label4Od.visible = !m_asksForGone && m_unfinished.size() > 1;
     Label4Od.text = m_state.wording(u"ועוד הזמנות שלא הושלמו: %1", u"More orders that were not finished: %1")
                         .arg(m_unfinished.size() - 1);
+}
+
+QString hatchala::offerText(const UnfinishedOrder& order) const {
+    const QString& number = order.state.number;
+    if (m_asksForGone)
+        return m_state
+            .wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
+            .arg(order.gone)
+            .arg(order.pictures);
+    switch (order.state.phase) {
+    case OrderState::Phase::Preparing:
+        return m_state
+            .wording(u"הזמנה מספר %1: הוכנו %2 מתוך %3 תמונות.", u"Order number %1: %2 of %3 pictures are prepared.")
+            .arg(number)
+            .arg(order.prepared)
+            .arg(order.pictures);
+    case OrderState::Phase::Prepared:
+        return m_state.wording(u"הזמנה מספר %1 מוכנה ועדיין לא נשלחה.", u"Order number %1 is ready and was not sent.")
+            .arg(number);
+    case OrderState::Phase::Arrived:
+        return m_state
+            .wording(u"הזמנה מספר %1 הגיעה, והמעבדה עדיין לא קיבלה על כך הודעה.",
+                     u"Order number %1 has arrived, and the lab was not told of it yet.")
+            .arg(number);
+    default:
+        break;
+    }
+    if (order.state.filesInAll == 0)
+        return m_state
+            .wording(u"השליחה של הזמנה מספר %1 לא הושלמה.", u"The sending of order number %1 was not finished.")
+            .arg(number);
+    return m_state
+        .wording(u"השליחה של הזמנה מספר %1 לא הושלמה: נשלחו %2 מתוך %3 קבצים.",
+                 u"The sending of order number %1 was not finished: %2 of %3 files were sent.")
+        .arg(number)
+        .arg(order.state.filesSent)
+        .arg(order.state.filesInAll);
+}
+
+bool hatchala::asksToThrowAway(const QString& number) {
+    return m_platform.dialogs.ask(m_state
+                                      .wording(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
+                                               u"Throw order number %1 away? It can't be brought back.")
+                                      .arg(number));
 }
 
 void hatchala::setHelp() {

@@ -264,6 +264,17 @@ TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked)
         chain.unload(PageId::MoogMeret);
         std::filesystem::remove_all(*test.drives.toHost(folder.path()));
     }
+    // Prepared again under another number.
+    give(true, complete);
+    const OrderFolder again(DrivePath(orders) / u"2026_11_22_KUP_1234^107"_s);
+    std::filesystem::create_directories(*test.drives.toHost(again.path()));
+    OrderState order;
+    order.replaces = name;
+    ASSERT_TRUE(WriteOrderState(test.files, again, order));
+    MoogMeret& page = start();
+    page.List3_Click(page.controls().List3.find(name));
+    EXPECT_EQ(page.phase(), MoogMeret::Phase::Orders);
+    EXPECT_TRUE(test.dialogs.messages.last().contains(u"107"_s));
 }
 
 TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {

@@ -127,6 +127,8 @@ TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
     preparing.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\gone.jpg"_s};
     OrderState sending;
     sending.phase = OrderState::Phase::Sending;
+    sending.filesSent = 3;
+    sending.filesInAll = 7;
     const OrderFolder newer = give(u"106"_s, preparing);
     const OrderFolder older = give(u"105"_s, sending);
 
@@ -160,6 +162,7 @@ TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
     page->Command4Bitul_Click();
     EXPECT_FALSE(machine.files.folderExists(newer.path()));
     EXPECT_FALSE(page->controls().Label4Od.visible);
+    EXPECT_TRUE(page->controls().Label4Hemshech.text.contains(u"3 מתוך 7"_s));
     page->Command4Hemshech_Click();
     ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
     EXPECT_EQ(state.transfer.OrderFolder, older.path());

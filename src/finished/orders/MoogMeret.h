@@ -14,6 +14,7 @@ class OrderFolder;
 class PageChain;
 struct OrderDetails;
 struct Platform;
+struct UnfinishedOrder;
 
 struct MoogMeretControls : Controls {
     Caption Title{*this, u"Title"};
@@ -189,6 +190,13 @@ private:
     void leaveProgram();
 
     // MoogMeretTexts.cpp
+    void tellReplaced(const OrderFolder& again);
+    void tellNotFinished();
+    void tellGone(const UnfinishedOrder& order);
+    bool asksToFinish();
+    bool asksToSendWithoutDetails();
+    bool asksToGoOnWithoutGone(const UnfinishedOrder& order);
+    bool asksToThrowAway(const QString& number);
     bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
 
     void sendByMail();

@@ -2,7 +2,9 @@
 #include "common/DrivePath.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/CaptionTexts.h"
@@ -67,6 +69,46 @@ bool MoogMeret::asks(const char16_t* hebrew, const char16_t* english, const QStr
     for (const QString& number : numbers)
         question = question.arg(number);
     return m_platform.dialogs.ask(question);
+}
+
+void MoogMeret::tellReplaced(const OrderFolder& again) {
+    m_platform.dialogs.message(m_state
+                                   .wording(u"הזמנה זו הוכנה מחדש במספר %1, ונשלחת רק במספר ההוא.",
+                                            u"This order was prepared again under number %1, and is sent only there.")
+                                   .arg(OrderNumberOf(again.name())));
+}
+
+void MoogMeret::tellNotFinished() {
+    m_platform.dialogs.message(
+        m_state.wording(u"הזמנה זו לא הושלמה. ייתכן שתוכנית אחרת במחשב זה מכינה אותה עכשיו.",
+                        u"This order was not finished. Another program on this computer may be preparing it now."));
+}
+
+void MoogMeret::tellGone(const UnfinishedOrder& order) {
+    m_platform.dialogs.message(
+        m_state.wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
+            .arg(order.gone)
+            .arg(order.pictures));
+}
+
+bool MoogMeret::asksToFinish() {
+    return asks(u"הזמנה זו לא הושלמה. להשלים אותה עכשיו?", u"This order was not finished. Finish it now?");
+}
+
+bool MoogMeret::asksToSendWithoutDetails() {
+    return asks(u"להזמנה זו חסרים הפרטים. לשלוח את מה שיש?",
+                u"The details of this order are missing. Send what is there?");
+}
+
+bool MoogMeret::asksToGoOnWithoutGone(const UnfinishedOrder& order) {
+    return asks(u"%1 מתוך %2 התמונות אינן עוד במקומן. להמשיך בלעדיהן?",
+                u"%1 of %2 pictures are no longer where they were. Go on without them?",
+                {QString::number(order.gone), QString::number(order.pictures)});
+}
+
+bool MoogMeret::asksToThrowAway(const QString& number) {
+    return asks(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
+                u"Throw order number %1 away? It can't be brought back.", {number});
 }
 
 void MoogMeret::showWhatIsMarked() {
