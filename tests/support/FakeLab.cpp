@@ -118,6 +118,7 @@ public:
                 {name, false, m_lab.listsLengths ? std::optional<qint64>(bytes.size()) : std::nullopt});
         if (listing.entries.empty() && m_lab.refusesEmptyListings && empty == EmptyFolder::IsListed)
             return no(u"550 No files found."_s).failure();
+        listing.refused = listing.entries.empty() && m_lab.refusesEmptyListings;
         if (m_here.contains(u'^'))
             listing.unread = m_lab.unreadLine;
         return listing;
@@ -181,6 +182,8 @@ Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const
 
 Result<QByteArray> FakeLab::fetch(const QString& url) {
     urls += url;
+    if (onFetch)
+        onFetch();
     return QByteArray("ok");
 }
 

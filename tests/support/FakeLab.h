@@ -53,6 +53,8 @@ public:
     std::function<void(const QString& name)> onPut;
     // Runs as a connection is asked for; the number counts from 1.
     std::function<void(int number)> onConnect;
+    // Runs while an address of the site is fetched.
+    std::function<void()> onFetch;
 
     // What the server saw.
     QStringList puts; // names, also of puts that failed

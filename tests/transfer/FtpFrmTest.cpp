@@ -62,7 +62,6 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         const FtpFrmControls& shown = page.controls();
         const bool success = each.end == SendingPhase::Success;
         EXPECT_EQ(page.phase(), each.end);
-        EXPECT_EQ(page.AllDone(), success ? 1 : 0);
         EXPECT_EQ(shown.Label3.text, each.status);
         EXPECT_EQ(shown.Picture6.visible, each.end == SendingPhase::NotAll);
         EXPECT_EQ(shown.Label34.visible && shown.Label34.text.startsWith(u"נסיון רביעי"_s),
@@ -137,7 +136,7 @@ TEST_F(FtpFrmTest, TakesTheLinesOfAResendAndForgetsTheCustomerBefore) {
     EXPECT_EQ(page.controls().Label21.text, u"11"_s);
     EXPECT_TRUE(rig.state.handOver.lines.isEmpty());
     rig.countDown();
-    EXPECT_EQ(page.AllDone(), 1);
+    EXPECT_EQ(page.phase(), SendingPhase::Success);
     EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::second(), FtpFrmRig::proof()}));
 }
 
@@ -193,7 +192,7 @@ TEST_F(FtpFrmTest, WithoutItsTextTheOrderSendsThePicturesAndSaysSo) {
     rig.send();
     EXPECT_EQ(lab.puts, FtpFrmRig::names().mid(1));
     EXPECT_TRUE(rig.page().controls().Picture2Lines.contains(u"NO details"_s));
-    EXPECT_EQ(rig.page().AllDone(), 1);
+    EXPECT_EQ(rig.page().phase(), SendingPhase::Success);
 }
 
 TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
@@ -207,7 +206,7 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
     EXPECT_EQ(lab.puts, (QStringList{FtpFrmRig::log(), FtpFrmRig::sheet(), u"a_001_002.prk"_s, u"a_002_002.prk"_s,
                                      FtpFrmRig::proof()}));
     EXPECT_EQ(rig.page().controls().PicInProgKatanWidth, FtpFrmControls::Pic4ProgWidth);
-    EXPECT_EQ(rig.page().AllDone(), 1);
+    EXPECT_EQ(rig.page().phase(), SendingPhase::Success);
 }
 
 TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {

@@ -21,24 +21,17 @@ struct Guarded {
         lab.folders[u"zalamim234"_s];
         rig.state.Careful = careful;
         rig.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
-        log({});
-    }
-
-    void log(const QStringList& failed) {
         const QStringList items = {u"021015GNBC:\\pics\\aabb.jpg"_s, u"111015GNBC:\\pics\\aacc.jpg"_s};
         rig.write(FtpFrmRig::log(),
-                  OrderLog::of(rig.state, OrderLog::Layout::Plain, items, failed, rig.test.clock.time).write());
+                  OrderLog::of(rig.state, OrderLog::Layout::Plain, items, {}, rig.test.clock.time).write());
     }
     void remove(const QString& leaf) { EXPECT_TRUE(rig.test.files.removeFile(FtpFrmRig::local(leaf))); }
     // The state that an earlier run left; with a basket the order was never sent.
     void keep(const QStringList& basket, bool folderMadeByUs) {
-        OrderJournal journal(rig.test.files, OrderFolder(FtpFrmRig::folder()));
-        EXPECT_TRUE(journal.begin(rig.state, OrderState::Way::Ftp, basket));
-        EXPECT_TRUE(journal.prepared());
-        if (folderMadeByUs) {
-            EXPECT_TRUE(journal.sendingBegins(Sender::Ftp, true));
-        }
+        EXPECT_TRUE(journal().begin(rig.state, OrderState::Way::Ftp, basket) && journal().prepared());
+        EXPECT_TRUE(!folderMadeByUs || journal().sendingBegins(Sender::Ftp, true));
     }
+    OrderJournal journal() const { return {rig.test.files, OrderFolder(FtpFrmRig::folder())}; }
     OrderState kept() const {
         const Result<OrderState> state = ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()));
         return state ? *state : OrderState();
@@ -60,43 +53,15 @@ TEST(FtpGuards, AnOrderWithoutPicturesDoesNotLeave) {
         int messages;
         int questions;
     };
-    const auto noPrints = [](Guarded& order) {
-        order.remove(FtpFrmRig::first());
-        order.remove(FtpFrmRig::second());
-    };
     const auto onePrint = [](Guarded& order) { order.remove(FtpFrmRig::second()); };
+    const auto sheetAlone = [](Guarded& order) { order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::sheet()}); };
+    using enum SendingPhase;
     const Case cases[] = {
-        {"whole", [](Guarded&) {}, {}, SendingPhase::Countdown, 0, 0},
-        {"the whole choice cancelled",
-         [](Guarded& order) {
-             order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::sheet()});
-         },
-         {},
-         SendingPhase::NoOrder,
-         1,
-         0},
-        {"prints cleaned away", noPrints, {}, SendingPhase::NoOrder, 1, 0},
-        {"each picture failed",
-         [&](Guarded& order) {
-             noPrints(order);
-             order.log({u"C:\\pics\\aabb.jpg"_s, u"C:\\pics\\aacc.jpg"_s});
-         },
-         {},
-         SendingPhase::NoOrder,
-         1,
-         0},
-        {"one picture failed",
-         [&](Guarded& order) {
-             onePrint(order);
-             order.log({u"C:\\pics\\aacc.jpg"_s});
-         },
-         {},
-         SendingPhase::Countdown,
-         0,
-         0},
-        {"a picture is gone, no", onePrint, {false}, SendingPhase::NoOrder, 0, 1},
-        {"a picture is gone, yes", onePrint, {true}, SendingPhase::Countdown, 0, 1},
-        {"no log tells", [](Guarded& order) { order.remove(FtpFrmRig::log()); }, {}, SendingPhase::Countdown, 0, 0},
+        {"whole", [](Guarded&) {}, {}, Countdown, 0, 0},
+        {"the whole choice cancelled", sheetAlone, {}, Refused, 1, 0},
+        {"a picture is gone, no", onePrint, {false}, Refused, 0, 1},
+        {"a picture is gone, yes", onePrint, {true}, Countdown, 0, 1},
+        {"no log tells", [](Guarded& order) { order.remove(FtpFrmRig::log()); }, {}, Countdown, 0, 0},
     };
     for (const Case& each : cases) {
         for (const bool careful : {true, false}) {
@@ -110,9 +75,13 @@ TEST(FtpGuards, AnOrderWithoutPicturesDoesNotLeave) {
             if (careful && each.questions > 0) {
                 EXPECT_TRUE(order.rig.test.dialogs.questions[0].contains(u"2 תמונות, ורק 1"_s));
             }
-            if (careful && each.phase == SendingPhase::NoOrder) {
+            if (careful && each.phase == SendingPhase::Refused) {
                 order.rig.page().Command4_Click();
                 EXPECT_TRUE(order.lab.puts.isEmpty()) << "no other button sends what was refused";
+                order.rig.test.dialogs.answers = {true};
+                order.rig.page().Command10_Click();
+                EXPECT_EQ(order.rig.page().phase(),
+                          each.questions > 0 ? SendingPhase::Countdown : SendingPhase::Refused);
             }
         }
     }
@@ -167,47 +136,107 @@ TEST(FtpGuards, ALimitOfSilenceCountsFilesAndBytes) {
     EXPECT_FALSE(limit.over());
 }
 
-TEST(FtpGuards, TwoFilesWithoutAnAnswerEndTheSending) {
-    for (const bool careful : {true, false}) {
-        Guarded order(careful);
-        order.lab.deadConnects = FakeLab::always;
-        order.lab.deadConnectKind = Failure::Kind::TimedOut;
-        order.rig.send();
-        EXPECT_EQ(order.rig.page().phase(), SendingPhase::NotAll);
-        EXPECT_EQ(order.rig.page().controls().Label2.text.contains(u"איטי מדי"_s), careful);
-        EXPECT_EQ(order.rig.page().controls().Label34.text.isEmpty(), careful) << "the first attempt alone";
-        if (careful) {
-            EXPECT_EQ(order.lab.connects, 2 * 5);
-        } else {
-            EXPECT_GT(order.lab.connects, 4 * 5 * 5);
+TEST(FtpGuards, AServerThatFallsSilentEndsTheSending) {
+    // Nobody answers any more behind the put of this name; empty: from the first connect on.
+    const auto dead = [](const QString& after) {
+        return [=](Guarded& order) {
+            order.lab.deadConnectKind = Failure::Kind::TimedOut;
+            order.lab.deadConnects = after.isEmpty() ? FakeLab::always : 0;
+            order.lab.onPut = [=, &order](const QString& name) {
+                order.lab.deadConnects = name == after ? FakeLab::always : 0;
+            };
+        };
+    };
+    const auto wait = [](Guarded& order) {
+        for (int i = 0; i < 31; ++i) {
+            order.rig.test.clock.time = order.rig.test.clock.time.addSecs(10);
+            order.rig.page().Timer4Line_Tick();
         }
-        EXPECT_TRUE(order.rig.test.dialogs.messages.isEmpty()) << "the customer has not stopped it";
-        order.lab.deadConnects = 0;
-        order.rig.page().Command10_Click();
-        EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
+    };
+    const auto inAPut = [=](Guarded& order) {
+        order.lab.onPut = [=, &order](const QString& name) { name == FtpFrmRig::first() ? wait(order) : void(); };
+    };
+    const auto inTheCheck = [=](Guarded& order) {
+        order.lab.onConnect = [=, &order](int number) { number == 6 ? wait(order) : void(); };
+    };
+    using enum SendingPhase;
+    const struct {
+        const char* what;
+        std::function<void(Guarded&)> arrange;
+        SendingPhase end, builtIn;
+        int connects, inHand;
+    } cases[] = {{"no file finds the server", dead({}), NotAll, NotAll, 2 * 5, 0},
+                 {"a put stands still", inAPut, NotAll, Success, 3, 1},
+                 {"the check does not find the server", dead(FtpFrmRig::proof()), Unclear, NotAll, 5 + 2 * 5, 0},
+                 {"the check stands still", inTheCheck, Unclear, Success, 6, 0}};
+    for (const auto& one : cases) {
+        for (const bool careful : {true, false}) {
+            SCOPED_TRACE(std::string(one.what) + (careful ? ", careful" : ""));
+            Guarded order(careful);
+            one.arrange(order);
+            order.rig.send();
+            const FtpFrmControls& shown = order.rig.page().controls();
+            EXPECT_EQ(order.rig.page().phase(), careful ? one.end : one.builtIn);
+            EXPECT_EQ((shown.Label2.text + shown.Label4Reason.text).contains(u"איטי מדי"_s), careful);
+            EXPECT_TRUE(order.rig.test.dialogs.messages.isEmpty()) << "the customer has not stopped it";
+            if (careful) {
+                EXPECT_TRUE(shown.Label34.text.isEmpty()) << "the first attempt alone";
+                EXPECT_EQ(order.lab.connects, one.connects);
+                EXPECT_EQ(order.kept().filesInHand.size(), one.inHand);
+            }
+            order.lab.onPut = {};
+            order.lab.onConnect = {};
+            order.lab.deadConnects = 0;
+            order.rig.page().Command10_Click();
+            EXPECT_EQ(order.rig.page().phase(), Success);
+            EXPECT_EQ(order.remote()[FtpFrmRig::first()], order.rig.localFiles()[FtpFrmRig::first()]);
+        }
     }
 }
 
-TEST(FtpGuards, APassThatStandsStillEndsAndItsFileIsBroken) {
-    for (const bool careful : {true, false}) {
-        Guarded order(careful);
-        order.lab.onPut = [&](const QString& name) {
-            for (int i = 0; name == FtpFrmRig::first() && i < 31; ++i) {
-                order.rig.test.clock.time = order.rig.test.clock.time.addSecs(10);
-                order.rig.page().Timer4Line_Tick();
-            }
+TEST(FtpGuards, AReportIsCutByAStopAndByTimeAndRepeatedByTheOperator) {
+    const std::function<void(FtpFrm&)> ways[] = {[](FtpFrm& page) { page.Command15_Click(); },
+                                                 [](FtpFrm& page) {
+                                                     for (int second = 0; second < 120; ++second)
+                                                         page.Timer4Report_Tick();
+                                                 },
+                                                 [](FtpFrm& page) { page.Image3_Click(); }};
+    for (const auto& cut : ways) {
+        Guarded order(true);
+        order.lab.onFetch = [&] {
+            EXPECT_EQ(order.rig.page().phase(), SendingPhase::Reporting);
+            cut(order.rig.page());
         };
         order.rig.send();
-        EXPECT_EQ(order.rig.page().phase(), careful ? SendingPhase::NotAll : SendingPhase::Success);
-        EXPECT_EQ(order.lab.aborts, careful ? 1 : 0);
-        if (!careful)
+        FtpFrm& page = order.rig.page();
+        EXPECT_EQ(order.lab.urls.size(), 1) << "no further call";
+        EXPECT_GE(order.lab.aborts, 1);
+        EXPECT_EQ(order.kept().report, OrderState::Report::Begun);
+        EXPECT_EQ(order.rig.chain.hasEnded(), &cut == &ways[2]);
+        if (&cut == &ways[2])
             continue;
-        EXPECT_EQ(order.lab.puts.last(), FtpFrmRig::first());
-        EXPECT_EQ(order.kept().filesInHand, QStringList(FtpFrmRig::local(FtpFrmRig::first()).text()));
-        order.lab.onPut = {};
-        order.rig.page().Command10_Click();
-        EXPECT_EQ(order.rig.page().phase(), SendingPhase::Success);
-        EXPECT_EQ(order.remote()[FtpFrmRig::first()], order.rig.localFiles()[FtpFrmRig::first()]);
+        EXPECT_EQ(page.phase(), SendingPhase::Success);
+        EXPECT_TRUE(page.reportUnknown() && page.mayReportAgain());
+        order.lab.onFetch = {};
+        page.Command4Dooach_Click();
+        EXPECT_EQ(page.phase(), SendingPhase::Success);
+        EXPECT_EQ(order.lab.urls.size(), 1 + 3);
+        EXPECT_EQ(order.kept().report, OrderState::Report::Done);
+        EXPECT_FALSE(page.reportUnknown());
+    }
+}
+
+// Killed between the verdict and the report; meanwhile the lab has taken the files away.
+TEST(FtpGuards, AnOrderThatArrivedBeforeIsOnlyReported) {
+    for (const bool careful : {true, false}) {
+        Guarded order(careful);
+        order.keep({}, true);
+        ASSERT_TRUE(order.journal().arrived(true));
+        EXPECT_EQ(order.rig.start().phase(), SendingPhase::Success);
+        EXPECT_EQ(order.lab.connects, 0);
+        EXPECT_EQ(order.lab.urls.size(), 3);
+        EXPECT_EQ(order.kept().phase, OrderState::Phase::Reported);
+        EXPECT_EQ(order.rig.page().provenByNameOnly(), careful);
     }
 }
 
@@ -215,48 +244,51 @@ TEST(FtpGuards, APassThatStandsStillEndsAndItsFileIsBroken) {
 TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
     using Phase = OrderState::Phase;
     const QByteArray otherLog = "\"00\",\"00\"\r\n\"Shemot.n1\",\"Someone else\"\r\n";
+    const auto askFor = [](Guarded& order) { EXPECT_TRUE(order.journal().folderIsAsked()); };
     struct Case {
         const char* what;
         std::function<void(Guarded&)> arrange;
         bool ours;
     };
+    const auto lies = [](const QString& name, const QByteArray& bytes) {
+        return [=](Guarded& order) { order.remote() = {{name, bytes}}; };
+    };
+    const auto refused = [&](Guarded& order) {
+        askFor(order);
+        EXPECT_TRUE(order.journal().folderIsRefused());
+    };
+    const auto older = [](Guarded& order) {
+        static_cast<void>(order.rig.test.files.removeFile(FtpFrmRig::local(u".order"_s)));
+        order.rig.takeUpAgain(FtpFrmRig::names().mid(0, 4));
+    };
+    const auto unread = [](Guarded& order) { order.lab.refusesEmptyListings = true; };
+    const auto askedAndUnread = [&](Guarded& order) {
+        askFor(order);
+        unread(order);
+    };
+    const auto ours = [](Guarded& order) {
+        order.remote() = {{FtpFrmRig::first(), "of an earlier try"}};
+        order.keep({}, true);
+    };
+    const auto hidden = [&](Guarded& order) {
+        order.remote() = {{FtpFrmRig::log(), otherLog}};
+        order.lab.hiddenFolder = FtpFrmRig::name();
+    };
+    const QByteArray ownLog = Guarded(true).rig.localFiles()[FtpFrmRig::log()];
     const Case cases[] = {
         {"nothing there", [](Guarded& order) { order.lab.folders.erase(FtpFrmRig::remoteFolder()); }, true},
-        {"an empty folder", [](Guarded&) {}, true},
-        {"an empty folder, whose listing is refused", [](Guarded& order) { order.lab.refusesEmptyListings = true; },
-         true},
-        {"its own log",
-         [](Guarded& order) {
-             order.remote() = {{FtpFrmRig::log(), order.rig.localFiles()[FtpFrmRig::log()]}, {u"x.jpp"_s, "x"}};
-         },
-         true},
-        {"another log",
-         [&](Guarded& order) {
-             order.remote() = {{FtpFrmRig::log(), otherLog}};
-         },
-         false},
-        {"half of its log",
-         [](Guarded& order) {
-             order.remote() = {{FtpFrmRig::log(), order.rig.localFiles()[FtpFrmRig::log()].chopped(1)}};
-         },
-         false},
-        {"names, and no log",
-         [](Guarded& order) {
-             order.remote() = {{FtpFrmRig::first(), "another's"}};
-         },
-         false},
-        {"made by this order",
-         [](Guarded& order) {
-             order.remote() = {{FtpFrmRig::first(), "of an earlier try"}};
-             order.keep({}, true);
-         },
-         true},
-        {"another log, and no listing names the folder",
-         [&](Guarded& order) {
-             order.remote() = {{FtpFrmRig::log(), otherLog}};
-             order.lab.hiddenFolder = FtpFrmRig::name();
-         },
-         false},
+        {"an empty folder", [](Guarded&) {}, false},
+        {"an empty folder, and killed before the answer to its making", askFor, true},
+        {"an empty folder, and its making refused", refused, false},
+        {"an empty folder of an older version", older, true},
+        {"a refused listing", unread, false},
+        {"a refused listing, and killed before the answer to its making", askedAndUnread, true},
+        {"its own log", lies(FtpFrmRig::log(), ownLog), true},
+        {"another log", lies(FtpFrmRig::log(), otherLog), false},
+        {"half of its log", lies(FtpFrmRig::log(), ownLog.chopped(1)), false},
+        {"names, and no log", lies(FtpFrmRig::first(), "another's"), false},
+        {"made by this order", ours, true},
+        {"another log, and no listing names the folder", hidden, false},
     };
     for (const Case& each : cases) {
         for (const bool careful : {true, false}) {
@@ -273,9 +305,9 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
                     EXPECT_TRUE(order.rig.test.files.writeWhole(DrivePath(u"C:\\pics\\aabb.jpg"_s), "picture"));
                 }
                 each.arrange(order);
-                const FakeLab::Folder before = order.remote();
                 // On the server the next number is another's too.
                 order.lab.folders[u"zalamim234/2026_11_21_KUP_1234^106"_s];
+                const auto before = order.lab.folders;
                 order.rig.send();
                 const bool sends = each.ours || !careful;
                 EXPECT_EQ(order.lab.puts.isEmpty(), !sends);
@@ -284,7 +316,7 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
                     EXPECT_GE(order.kept().phase, Phase::Sending);
                     continue;
                 }
-                EXPECT_EQ(order.remote(), before);
+                EXPECT_EQ(order.lab.folders, before);
                 if (!basketKept || !pictureThere) {
                     EXPECT_EQ(order.rig.page().phase(), SendingPhase::CallLab);
                     EXPECT_EQ(order.rig.page().controls().Label34.text, QString()) << "the first attempt alone";
@@ -333,6 +365,27 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
         order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::second()});
         order.rig.test.dialogs.answers = {true};
     };
+    const auto telling = [=](bool listed, bool sized) {
+        return [=](Guarded& order) {
+            onFirst(1, half)(order);
+            order.lab.listsLengths = listed;
+            order.lab.tellsSize = sized;
+        };
+    };
+    const auto lies = [](const QString& name) {
+        return [=](Guarded& order) {
+            order.remote()[name] = "x";
+            order.keep({}, true);
+        };
+    };
+    const auto goneAndStranger = [=](Guarded& order) {
+        onFirst(1, [](const QByteArray&) { return Content(); })(order);
+        lies(u"Thumbs.db"_s)(order);
+    };
+    const auto oneCrMissing = [=](Guarded& order) {
+        order.rig.write(FtpFrmRig::first(), QByteArray(500, 'x') + '\r');
+        onFirst(1, [](const QByteArray& content) { return Content(content.chopped(1)); })(order);
+    };
     using enum SendingPhase;
     const Case cases[] = {
         {"whole", [](Guarded&) {}, Success, 0, true, false, Success},
@@ -342,52 +395,15 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
          Success},
         {"the last byte is missing", onFirst(1, [](const QByteArray& content) { return Content(content.chopped(1)); }),
          Success, 1, true, false, Success},
-        {"the one CR of a picture is missing",
-         [&](Guarded& order) {
-             const QByteArray oneCr = QByteArray(500, 'x') + '\r';
-             order.rig.write(FtpFrmRig::first(), oneCr);
-             onFirst(1, [](const QByteArray& content) { return Content(content.chopped(1)); })(order);
-         },
-         Success, 1, true, false, Success},
+        {"the one CR of a picture is missing", oneCrMissing, Success, 1, true, false, Success},
         {"a byte too many", onFirst(1, [](const QByteArray& content) { return Content(content + 'x'); }), Success, 1,
          true, false, Success},
-        {"half of a file, and no SIZE",
-         [&](Guarded& order) {
-             onFirst(1, half)(order);
-             order.lab.tellsSize = false;
-         },
-         Success, 1, true, false, Success},
-        {"half of a file, and the listing tells no lengths",
-         [&](Guarded& order) {
-             onFirst(1, half)(order);
-             order.lab.listsLengths = false;
-         },
-         Success, 1, true, false, Success},
-        {"half of a file, and nothing tells lengths",
-         [&](Guarded& order) {
-             onFirst(1, half)(order);
-             order.lab.listsLengths = order.lab.tellsSize = false;
-         },
-         Success, 0, true, true, Success},
-        {"the file is gone, and a stranger there",
-         [&](Guarded& order) {
-             onFirst(1, [](const QByteArray&) { return Content(); })(order);
-             order.remote()[u"Thumbs.db"_s] = "x";
-             order.keep({}, true);
-         },
-         Success, 1, true, false, Success},
-        {"strangers beside it",
-         [](Guarded& order) {
-             order.remote()[u"Thumbs.db"_s] = "x";
-             order.keep({}, true);
-         },
-         Success, 0, true, false, AllThere},
-        {"another file of the same name",
-         [](Guarded& order) {
-             order.remote()[FtpFrmRig::second()] = "x";
-             order.keep({}, true);
-         },
-         Success, 0, true, false, Success},
+        {"half of a file, and no SIZE", telling(true, false), Success, 1, true, false, Success},
+        {"half of a file, and the listing tells no lengths", telling(false, true), Success, 1, true, false, Success},
+        {"half of a file, and nothing tells lengths", telling(false, false), Success, 0, true, true, Success},
+        {"the file is gone, and a stranger there", goneAndStranger, Success, 1, true, false, Success},
+        {"strangers beside it", lies(u"Thumbs.db"_s), Success, 0, true, false, AllThere},
+        {"another file of the same name", lies(FtpFrmRig::second()), Success, 0, true, false, Success},
         {"CR dropped", each([](QByteArray content) { return content.replace("\r", ""); }), CallLab, -4, false, false,
          Success},
         {"CR LF to LF", each([](QByteArray content) { return content.replace("\r\n", "\n"); }), CallLab, -4, false,
@@ -399,6 +415,12 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
          }),
          CallLab, 0, false, false, Success},
         {"a chosen part of an order that is not there", part, AllThere, -2, false, false, Success},
+        {"fewer than the log names, as agreed",
+         [](Guarded& order) {
+             order.remove(FtpFrmRig::second());
+             order.rig.test.dialogs.answers = {true};
+         },
+         AllThere, -1, false, false, Success},
         {"a chosen part that makes the order whole",
          [&](Guarded& order) {
              part(order);
@@ -417,8 +439,13 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
             one.arrange(order);
             order.rig.send();
             EXPECT_EQ(order.rig.page().phase(), careful ? one.end : one.builtIn);
-            if (!careful)
+            const bool chosen = QByteArray(one.what).contains("chosen part");
+            EXPECT_EQ(order.kept().fewerAgreed, careful && QByteArray(one.what).contains("as agreed"));
+            if (!careful) {
+                EXPECT_EQ(order.kept().phase == Phase::Reported, hasArrived(one.builtIn) && !chosen);
                 continue;
+            }
+            EXPECT_EQ(order.kept().sentBefore, chosen && one.end == AllThere) << "not offered as unfinished";
             EXPECT_EQ(order.lab.puts.size(), FtpFrmRig::names().size() + one.putsMore);
             EXPECT_EQ(order.lab.urls.size(), one.reported ? 3 : 0);
             EXPECT_TRUE(one.end != Success || one.putsMore > 0 || order.rig.page().controls().Label34.text.isEmpty())
@@ -447,7 +474,7 @@ TEST(FtpGuards, AFileInHandThatLiesThereWholeIsNotSentTwice) {
             Guarded order(careful);
             order.keep({}, true);
             const QString path = FtpFrmRig::local(FtpFrmRig::first()).text();
-            ASSERT_TRUE(OrderJournal(order.rig.test.files, OrderFolder(FtpFrmRig::folder())).take(path));
+            ASSERT_TRUE(order.journal().take(path));
             const QByteArray bytes = order.rig.localFiles()[FtpFrmRig::first()];
             order.remote()[FtpFrmRig::first()] = whole ? bytes : bytes.left(60);
             order.rig.send();

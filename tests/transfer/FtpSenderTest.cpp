@@ -118,13 +118,6 @@ TEST_F(FtpSenderTest, WalksToTheLabsFolderWithOneLevelAndWithTwo) {
     EXPECT_EQ(told.count(FolderMissing), 1);
 }
 
-TEST_F(FtpSenderTest, TellsAMissingSessionOnceInAPass) {
-    lists.List1.append(base);
-    session.EnterFolderTK2();
-    session.EnterFolderTK2();
-    EXPECT_EQ(told.count(NoSession), 1);
-}
-
 TEST_F(FtpSenderTest, MakesTheOrdersFolderOnceAndListsItAfterwards) {
     lists.List6.append(u"left over"_s);
     walk();
@@ -159,6 +152,17 @@ TEST_F(FtpSenderTest, NotesAFailedPutWithHourAndMinuteAsTheyAre) {
 // The faults that a relay can make on a real line stand with the real server; here those of a server's own doing.
 TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
     using enum SendingPhase;
+    const auto puts = [](const FakeLab::PutFault& fault, bool refusesDelete = false) {
+        return [=](Line& line) {
+            line.lab.putFaults = {fault};
+            line.lab.refusesDelete = refusesDelete;
+        };
+    };
+    const auto order = [](const QStringList& names) { return [=](Line& line) { line.order(names); }; };
+    const auto strangers = [=](Line& line) {
+        line.remote() = {{u"x1"_s, "x"}, {u"x2"_s, "x"}};
+        puts({u"01a.jpp"_s, FakeLab::always, -1})(line);
+    };
     const struct {
         const char* name;
         std::function<void(Line&)> arrange;
@@ -166,56 +170,19 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
         int attempts;
         qsizetype puts;
     } cases[] = {
-        {"clean", [](Line&) {}, Success, 1, 3},
         {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, Success, 1, 3},
-        {"an empty folder's listing is refused",
-         [](Line& line) {
-             line.remote();
-             line.lab.refusesEmptyListings = true;
-         },
-         Success, 1, 3},
         {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, NotAll, 4, 3},
-        {"no folder can be made", [](Line& line) { line.lab.refusesFolders = true; }, NotAll, 4, 0},
         {"login refused", [](Line& line) { line.lab.refusedLogins = FakeLab::always; }, NotAll, 4, 0},
-        {"put refused once",
-         [](Line& line) {
-             line.lab.putFaults = {{u"01a.jpp"_s, 1, -1}};
-         },
-         Success, 2, 4},
+        {"put refused once", puts({u"01a.jpp"_s, 1, -1}), Success, 2, 4},
         // The 60 tries end within the third attempt.
         {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
-        {"cut, and the remains can't be deleted",
-         [](Line& line) {
-             line.lab.putFaults = {{u"01a.jpp"_s, 1, 20}};
-             line.lab.refusesDelete = true;
-         },
-         Success, 2, 4},
-        {"cut in each attempt, remains stay",
-         [](Line& line) {
-             line.lab.putFaults = {{u"02b.jpp"_s, FakeLab::always, 20}};
-             line.lab.refusesDelete = true;
-         },
-         NotAll, 4, 6},
-        {"the folder of a local file itself",
-         [](Line& line) {
-             line.order({u"01a.jpp"_s, QString()});
-         },
-         NotAll, 4, 1},
-        {"all there, and a stranger beside it", [](Line& line) { line.remote()[u"stranger.jpp"_s] = "x"; }, AllThere, 4,
-         3},
-        {"strangers and a file that never arrives",
-         [](Line& line) {
-             line.remote() = {{u"x1"_s, "x"}, {u"x2"_s, "x"}};
-             line.lab.putFaults = {{u"01a.jpp"_s, FakeLab::always, -1}};
-         },
-         Unclear, 4, 6},
-        {"one name twice in the order",
-         [](Line& line) {
-             line.order({u"01a.jpp"_s, u"01a.jpp"_s, u"02b.jpp"_s});
-         },
-         Unclear, 1, 2},
-        {"an empty order", [](Line& line) { line.order({}); }, NoOrder, 1, 0},
+        {"cut, and the remains can't be deleted", puts({u"01a.jpp"_s, 1, 20}, true), Success, 2, 4},
+        {"cut in each attempt, remains stay", puts({u"02b.jpp"_s, FakeLab::always, 20}, true), NotAll, 4, 6},
+        {"the folder of a local file itself", order({u"01a.jpp"_s, QString()}), NotAll, 4, 1},
+        {"strangers and a file that never arrives", strangers, Unclear, 4, 6},
+        {"one name twice in the order", order({u"01a.jpp"_s, u"01a.jpp"_s, u"02b.jpp"_s}), Unclear, 1, 2},
+        {"an empty order", order({}), NoOrder, 1, 0},
     };
     for (const auto& each : cases) {
         SCOPED_TRACE(each.name);

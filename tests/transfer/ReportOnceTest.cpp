@@ -65,6 +65,10 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
         {"FTP, again", false, Sender::Ftp, Sending::Resend, 1, Phase::Reported, Done, Told::Now, Phase::Reported, Done},
         {"FTP, no reports", false, Sender::Ftp, Sending::NewOrder, 0, Phase::Arrived, NotYet, Told::NotWanted,
          Phase::Reported, NotYet},
+        {"FTP, a part", false, Sender::Ftp, Sending::Resend, 1, Phase::Sending, NotYet, Told::Now, Phase::Sending,
+         NotYet},
+        {"FTP, a part, no reports", false, Sender::Ftp, Sending::Resend, 0, Phase::Sending, NotYet, Told::NotWanted,
+         Phase::Sending, NotYet},
         {"a chain", false, Sender::Ftp, Sending::Chain, 1, Phase::Arrived, NotYet, Told::Now, Phase::Reported, Done},
         {"HTTP", false, Sender::Http, Sending::NewOrder, 0, Phase::Arrived, NotYet, Told::Now, Phase::Reported, Done},
         {"HTTP, again", false, Sender::Http, Sending::Resend, 1, Phase::Arrived, NotYet, Told::NotWanted,
@@ -111,6 +115,15 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
             EXPECT_EQ(kept().report, Done);
         }
     }
+}
+
+TEST_F(AReport, thatIsStoppedStaysBegun) {
+    OrderJournal journal(test.files, folder);
+    ASSERT_TRUE(journal.arrived(false));
+    calls.onOrder = [&] { stop.StopFlag = true; };
+    EXPECT_EQ(ReportOnce(state, test.files, journal, stop).tell(Sender::Ftp, calls), Told::Cut);
+    EXPECT_EQ(calls.heard.size(), 1) << "no done call";
+    EXPECT_EQ(kept().report, Report::Begun);
 }
 
 TEST_F(AReport, isNotBegunCarefullyWhereThatCouldNotBeKept) {

@@ -334,7 +334,7 @@ TEST_F(UploadFormTest, AnOrderWithoutPicturesCarefullyDoesNotLeave) {
     for (const QString& print : {UploadFormRig::first(), UploadFormRig::second(), UploadFormRig::third()})
         ASSERT_TRUE(rig.test.files.removeFile(UploadFormRig::folder() / print));
     rig.state.Careful = true;
-    EXPECT_EQ(rig.start().phase(), SendingPhase::NoOrder);
+    EXPECT_EQ(rig.start().phase(), SendingPhase::Refused);
     EXPECT_EQ(rig.test.dialogs.messages.size(), 1);
     EXPECT_TRUE(lab.urls.isEmpty());
     rig.state.Careful = false;
@@ -354,7 +354,8 @@ TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesWithoutBeingReport
     EXPECT_TRUE(rig.page().controls().Label4Do.text.contains(u"3 מתוך 4"_s));
     EXPECT_FALSE(rig.page().controls().Label4Count.visible) << "not the whole order went up";
     EXPECT_EQ(lab.reports.size(), 0);
-    EXPECT_EQ(ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder()))->phase, OrderState::Phase::Sending);
+    const Result<OrderState> kept = ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder()));
+    EXPECT_TRUE(kept->phase == OrderState::Phase::Sending && kept->fewerAgreed);
 }
 
 TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverItIsFound) {
@@ -376,6 +377,13 @@ TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverI
             EXPECT_EQ(other.posted.size(), 0);
         }
     }
+}
+
+TEST_F(UploadFormTest, AnOrderThatArrivedBeforeIsOnlyReported) {
+    ASSERT_TRUE(OrderJournal(rig.test.files, OrderFolder(UploadFormRig::folder())).arrived(true));
+    EXPECT_EQ(rig.start().phase(), SendingPhase::Success);
+    EXPECT_EQ(lab.reports.size(), 2);
+    EXPECT_EQ(lab.urls.size(), 2) << "no list";
 }
 
 TEST_F(UploadFormTest, AReportThatNobodyTakesIsNotRepeatedAndChangesNothing) {

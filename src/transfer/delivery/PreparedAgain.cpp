@@ -17,7 +17,8 @@ Outcome PreparedAgain::way() const {
 
 bool PreparedAgain::isPossible() const {
     const OrderState& kept = m_order.state();
-    return !kept.items.isEmpty() && GonePictures(m_state, m_platform.files, {m_order.folder(), kept}) == 0;
+    return !kept.items.isEmpty() && !ReplacementOf(m_state, m_platform.files, m_order.folder()) &&
+           GonePictures(m_state, m_platform.files, {m_order.folder(), kept}) == 0;
 }
 
 bool PreparedAgain::handOver(const IsTaken& isTaken) {

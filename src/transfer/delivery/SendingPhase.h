@@ -10,6 +10,7 @@ enum class SendingPhase {
     Preparing, // the order is read; the HTTP sender asks which files the server has
     NoOrder,   // the order has no files
     NoServer,  // the profile names no server
+    Refused,   // the order does not leave: it has no picture, or the customer does not want to send fewer
     Countdown, // the sending begins when the count ends
     Waiting,   // the customer has stopped the count
     Sending,

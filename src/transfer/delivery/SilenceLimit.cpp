@@ -7,14 +7,16 @@ namespace lumora {
 namespace {
 
 constexpr int mostSilentFiles = 2;
-constexpr qint64 window = 300;               // seconds
-constexpr qint64 leastBytes = window * 1000; // in a window
+constexpr qint64 window = 300;                // seconds
+constexpr qint64 leastOfPass = window * 1000; // bytes in a window
+constexpr qint64 leastOfCheck = 1000;
 // After a longer gap the machine has slept or its clock was set.
 constexpr qint64 longestGap = 60; // seconds
 
 } // namespace
 
-void SilenceLimit::begin() {
+void SilenceLimit::begin(Work work) {
+    m_least = work == Work::Pass ? leastOfPass : leastOfCheck;
     m_samples.clear();
     m_silentFiles = 0;
     m_tooSlow = false;
@@ -34,7 +36,7 @@ void SilenceLimit::moved(qint64 bytes, const QDateTime& now) {
     while (m_samples.size() > 1 && m_samples[1].time.secsTo(now) >= window)
         m_samples.pop_front();
     const Sample& then = m_samples.front();
-    m_tooSlow = m_tooSlow || (then.time.secsTo(now) >= window && bytes - then.bytes < leastBytes);
+    m_tooSlow = m_tooSlow || (then.time.secsTo(now) >= window && bytes - then.bytes < m_least);
 }
 
 bool SilenceLimit::over() const {

@@ -8,15 +8,16 @@ namespace lumora {
 
 struct SessionState;
 
-// Tells when a sending waits for a server that will not take it: two files in a row whose connects all ran into the
-// time limit, or a pass that moves under 1,000 bytes a second for five minutes. As built in, a sending waits for ever.
+// Tells when a sending waits for a server in vain: two files in a row, or reconnects of a check, whose connects all ran
+// into the time limit; a pass that moves under 1,000 bytes a second for five minutes, or a check that moves under 1,000
+// bytes in all that time. As built in, a sending waits without limit.
 class SilenceLimit {
 public:
     explicit SilenceLimit(const SessionState& state)
         : m_state(state) {}
 
-    // A pass begins.
-    void begin();
+    enum class Work { Pass, Check };
+    void begin(Work work = Work::Pass);
     // A file of the pass is done with: did all its connects run into the time limit?
     void connectsTimedOut(bool all);
     // Told about once a second while the pass runs. bytes: a count that only grows, with what a skipped file has.
@@ -30,6 +31,7 @@ private:
     };
 
     const SessionState& m_state;
+    qint64 m_least = 0;           // bytes of five minutes
     std::deque<Sample> m_samples; // of the last five minutes, and one older
     int m_silentFiles = 0;        // in a row
     bool m_tooSlow = false;

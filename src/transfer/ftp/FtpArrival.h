@@ -14,7 +14,7 @@ struct SessionState;
 
 // What proves that files lie whole on the FTP server: their names in a listing of the order's folder and, where the
 // listing or SIZE tells one, their lengths. As built in nothing is asked, and the count of names decides.
-// The connection stands in the order's folder, and there is what its listing told.
+// Wherever a connection is given, it stands in the order's folder, and "there" is the listing of that folder.
 class FtpArrival {
 public:
     FtpArrival(const SessionState& state, const Files& files)

@@ -15,45 +15,52 @@ bool FtpFolderOwner::asks() const {
     return m_state.Careful;
 }
 
+bool FtpFolderOwner::mayHaveMade(const OrderJournal& order) const {
+    const bool older = !order.known() && m_state.transfer.SugMishloah == Sending::Resend;
+    return order.state().makesFolder || order.state().sentBefore || older;
+}
+
 FtpFolderOwner::Owner FtpFolderOwner::of(const OrderJournal& order, FtpConnection& connection,
                                          const FtpListing& listing) const {
     if (!asks())
         return Owner::NotAsked;
     if (order.state().folderMadeByUs)
         return Owner::Ours;
-    if (!listing.unread.isEmpty())
-        return byLog(order, connection) == Owner::Ours ? Owner::Ours : Owner::NotKnown;
+    const QString log = order.folder().logPath().leaf();
     const auto isNamed = [](const FtpEntry& entry) {
         return !entry.name.isEmpty() && entry.name != u"."_s && entry.name != u".."_s;
     };
-    if (std::none_of(listing.entries.begin(), listing.entries.end(), isNamed))
-        return Owner::Ours;
-    const QString log = order.folder().logPath().leaf();
-    const auto found = std::find_if(listing.entries.begin(), listing.entries.end(),
-                                    [&](const FtpEntry& entry) { return entry.name == log; });
-    if (found == listing.entries.end())
+    const bool isRead = listing.unread.isEmpty() && !listing.refused;
+    if (isRead && std::none_of(listing.entries.begin(), listing.entries.end(), isNamed))
+        return mayHaveMade(order) ? Owner::Ours : Owner::Foreign;
+    if (isRead && std::none_of(listing.entries.begin(), listing.entries.end(),
+                               [&](const FtpEntry& entry) { return entry.name == log; }))
         return Owner::Foreign;
-    return byLog(order, connection);
+    const Log there = logThere(order, connection);
+    if (there == Log::Same)
+        return Owner::Ours;
+    if (there == Log::NotKnown || !listing.unread.isEmpty())
+        return Owner::NotKnown;
+    return listing.refused && there == Log::None && mayHaveMade(order) ? Owner::Ours : Owner::Foreign;
 }
 
-FtpFolderOwner::Owner FtpFolderOwner::byLog(const OrderJournal& order, FtpConnection& connection) const {
+// None where the server refuses it: no other try would tell more.
+FtpFolderOwner::Log FtpFolderOwner::logThere(const OrderJournal& order, FtpConnection& connection) const {
     const DrivePath log = order.folder().logPath();
     const Result<QByteArray> ours = m_files.read(log);
-    if (!ours)
-        return Owner::Foreign;
     const DrivePath fetched = order.folder().fetchedLogPath();
     const Result<HostPath> target = m_files.host(fetched);
     if (!target)
-        return Owner::NotKnown;
+        return Log::NotKnown;
     const Result<void> got = connection.get(log.leaf(), *target);
     const Result<QByteArray> theirs = got ? m_files.read(fetched) : Result<QByteArray>(got.failure());
     static_cast<void>(m_files.removeFile(fetched)); // hidden; the next fetch replaces one that stays
     if (!theirs) {
         const Failure::Kind why = theirs.failure().kind;
         const bool answered = why == Failure::Kind::Refused || why == Failure::Kind::AccessDenied;
-        return answered ? Owner::Foreign : Owner::NotKnown; // no other try would tell more
+        return answered ? Log::None : Log::NotKnown;
     }
-    return *theirs == *ours ? Owner::Ours : Owner::Foreign;
+    return ours && *theirs == *ours ? Log::Same : Log::Other;
 }
 
 } // namespace lumora

@@ -14,7 +14,8 @@ class FtpFolderOwner {
 public:
     enum class Owner {
         NotAsked, // as built in
-        Ours,     // made by this order, or empty, or with this order's log in it, byte for byte
+        Ours,     // made by this order, or with this order's log in it, byte for byte; empty alone where the making may
+                  // have come through unanswered, and where an older version, which kept no state, may have made it
         Foreign,
         NotKnown, // the listing could not be read, or the line was cut
     };
@@ -25,12 +26,14 @@ public:
 
     // True when the owner is asked for; a folder is then never joined without its listing.
     bool asks() const;
-    // The connection stands in the folder, whose listing this is. Fetches the log into a hidden file beside the order's
-    // own, which is removed.
+    // The connection stands in the folder, whose listing this is; a refused one proves nothing. Fetches the log into a
+    // hidden file beside the order's own, which is removed.
     Owner of(const OrderJournal& order, FtpConnection& connection, const FtpListing& listing) const;
 
 private:
-    Owner byLog(const OrderJournal& order, FtpConnection& connection) const;
+    enum class Log { Same, Other, None, NotKnown };
+    Log logThere(const OrderJournal& order, FtpConnection& connection) const;
+    bool mayHaveMade(const OrderJournal& order) const;
 
     const SessionState& m_state;
     const Files& m_files;

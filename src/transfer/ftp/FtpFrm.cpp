@@ -138,6 +138,10 @@ void FtpFrm::sendNow() {
 void FtpFrm::sendAgain() {
     if (!canSend())
         return;
+    if (phase() == SendingPhase::Refused) {
+        begin();
+        return;
+    }
     m_sender.pass.UserStopped = 0;
     m_sender.refill();
     sendNow();
@@ -208,6 +212,10 @@ void FtpFrm::succeed() {
 
 void FtpFrm::finish(SendingPhase end) {
     m_sender.report.keepArrival(m_sender.arrival(end), end, m_sender.provenByNameOnly());
+    showEnd(end);
+}
+
+void FtpFrm::showEnd(SendingPhase end) {
     if (end == SendingPhase::Success)
         succeed();
     if (m_sender.stop.left)

@@ -80,7 +80,6 @@ public:
     const FtpLists& lists() const { return m_sender.lists; }
     const FtpSender& sender() const { return m_sender; }
     bool counting() const { return Timer1.running(); }
-    std::int16_t AllDone() const { return phase() == SendingPhase::Success ? 1 : 0; }
 
     // The signal is Page::changed().
 
@@ -111,6 +110,7 @@ private:
     bool canSend() const;
     bool inPieces() const;
     void finish(SendingPhase end);
+    void showEnd(SendingPhase end);
     void succeed();
     void showFailure();
     void showProof();
@@ -206,7 +206,6 @@ private:
     int m_fileCount = 0;      // files found in the folder
     std::optional<int> m_printCount;
     std::optional<int> m_minutesLeft; // known from the second piece on
-    bool m_refused = false;           // the customer or a guard did not let the order leave
     bool m_incomplete = false;        // the pass has left files behind
     bool m_byHand = false;            // a step of the manual panel is under way
     // Command26 shows the proof picture if a page has set both; none does.

@@ -25,7 +25,7 @@ void FtpFrm::tellForeign() {
 }
 
 void FtpFrm::watchLine() {
-    m_sender.pass.watch();
+    m_sender.watch();
 }
 
 ReportCalls* FtpFrm::reportCalls() {

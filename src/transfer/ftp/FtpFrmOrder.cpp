@@ -112,14 +112,20 @@ void FtpFrm::ShowOrderSummary() {
 void FtpFrm::refuseOrder() {
     if (m_sender.stop.left)
         return;
-    m_refused = !lists().List3.isEmpty();
+    const bool nothing = lists().List3.isEmpty();
     clearLists();
-    enter(SendingPhase::NoOrder);
+    enter(nothing ? SendingPhase::NoOrder : SendingPhase::Refused);
 }
 
 void FtpFrm::armCountdown() {
     m_platform.pump.pump();
     countPictures();
+    // The lab may have taken its files away since.
+    if (!lists().List3.isEmpty() && m_sender.onlyReportIsLeft()) {
+        m_sender.beginOrder();
+        showEnd(SendingPhase::Success);
+        return;
+    }
     if (lists().List3.isEmpty() || !mayBeSent()) {
         refuseOrder();
         return;

@@ -34,6 +34,8 @@ std::span<const PhaseLook> FtpFrm::looks() const {
                   sendingTitle,
                   {u"קוראים את ההזמנה. נא להמתין.", u"Reading the order. Please wait."}},
         PhaseLook{SendingPhase::NoOrder, SendingSign::Bad, NewOrder, {NewOrder}, nothingTitle, noOrderAdvice},
+        PhaseLook{
+            SendingPhase::Refused, SendingSign::Bad, SendAgain, {SendAgain, NewOrder}, notCompleteTitle, refusedAdvice},
         PhaseLook{SendingPhase::NoServer, SendingSign::Bad, NewOrder, {NewOrder}, nothingTitle, noServerAdvice},
         PhaseLook{SendingPhase::Countdown, SendingSign::Seconds, SendNow, {SendNow, Hold}, readyTitle, readyAdvice},
         PhaseLook{SendingPhase::Waiting,
@@ -97,8 +99,6 @@ QString FtpFrm::advice(const PhaseLook& row) const {
             u"להודיע לחנות.",
             u"The server did not tell what has arrived. Press Send again to check and send once more. If "
             u"this comes again, please tell the shop.");
-    if (row.phase == SendingPhase::NoOrder && m_refused)
-        return wording(refusedAdvice);
     const QString text = wording(row.advice);
     return text.contains(u'%') ? text.arg(m_sender.check.NumOnServer).arg(m_sender.NumToSend) : text;
 }
@@ -109,8 +109,6 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     const bool ended = row.main == SendAgain || row.phase == SendingPhase::CallLab;
     Command15.enabled = Command21.enabled = underWay;
     Command15.visible = row.buttons.testFlag(Stop);
-    if (row.phase == SendingPhase::NoOrder && m_refused)
-        Label4Title.text = wording(notCompleteTitle);
     Image5.visible = row.buttons.testFlag(SendNow);
     Image5.enabled = Command23.enabled = row.main == SendNow; // before that no order is listed
     if (!underWay && row.phase != SendingPhase::Preparing)

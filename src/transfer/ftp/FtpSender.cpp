@@ -29,7 +29,10 @@ private:
                 return SendingPhase::NoOrder;
             }
         }
+        m_sender.check.begin();
         compare(attempt);
+        if (m_sender.check.endSilent())
+            return m_sender.unheardEnd();
         const Verdict verdict = m_sender.verdict();
         // After a stop the count is valid only if this check has read the server's folder itself.
         if (m_stop.StopFlag && !(verdict == Verdict::All && m_sender.check.freshCount)) {
@@ -52,7 +55,7 @@ private:
     // Leaves the missing files in List3, unless the count or a folder that was not read says nothing of them.
     void compare(int attempt) {
         m_sender.check.check(attempt);
-        if (!m_sender.lacksFiles() || m_stop.left)
+        if (!m_sender.lacksFiles() || m_stop.left || m_stop.StopFlag)
             return;
         // The check may have failed and counted an older listing.
         m_sender.check.ListServerFiles();
@@ -90,7 +93,10 @@ private:
     }
 
     std::optional<SendingPhase> checkArrival(int round) override {
+        m_sender.check.begin();
         m_sender.check.ListServerFiles();
+        if (m_sender.check.endSilent())
+            return m_sender.unheardEnd();
         const Verdict verdict = m_sender.verdict();
         if (verdict == Verdict::All && (m_sender.check.freshCount || !m_stop.StopFlag))
             return m_sender.arrivedEnd();
@@ -121,8 +127,9 @@ private:
 FtpSender::FtpSender(SessionState& state, const Platform& platform, SendingEvents& events)
     : session(state, platform, events, stop, lists)
     , pass(state, platform, events, stop, lists, session)
-    , check(state.transfer, platform, events, stop, lists, session)
+    , check(state, platform, events, stop, lists, session)
     , report(state, platform, stop, Sender::Ftp, [this](const Result<void>& written) { session.keep(written); })
+    , m_transfer(state.transfer)
     , m_platform(platform)
     , m_events(events) {}
 
@@ -134,6 +141,11 @@ void FtpSender::stopNow() {
 void FtpSender::leave() {
     stop.left = true;
     m_platform.internet.abort();
+}
+
+void FtpSender::watch() {
+    pass.watch();
+    check.watch();
 }
 
 void FtpSender::clearLists() {
@@ -163,6 +175,11 @@ void FtpSender::takeBroken() {
     }
     inHand.removeIf([&](const QString& path) { return reported.contains(path); });
     pass.beginOrder(inHand);
+}
+
+bool FtpSender::onlyReportIsLeft() const {
+    return m_transfer.SugMishloah == Sending::NewOrder &&
+           LabReport::isLeft(OrderJournal(m_platform.files, OrderFolder(m_transfer.OrderFolder)).state());
 }
 
 std::int16_t FtpSender::countList3() const {
@@ -236,7 +253,10 @@ SendingPhase FtpSender::silentEnd() const {
                                                                            : SendingPhase::Unclear;
     if (verdict() == Verdict::All)
         return arrivedEnd();
-    // All was sent, and the folder can't be read: nobody knows.
+    return unheardEnd();
+}
+
+SendingPhase FtpSender::unheardEnd() const {
     return pass.triedAll() ? SendingPhase::Unclear : SendingPhase::NotAll;
 }
 

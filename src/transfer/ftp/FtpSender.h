@@ -19,6 +19,8 @@ public:
     // Takes List3 as the whole order of OrderFolder, and as broken what an earlier sending left so of it: the files of
     // kashloo.txt and those that were in hand when a program ended.
     void beginOrder();
+    // OrderFolder's order is new, and an earlier run found that it arrived: only the lab was not told.
+    bool onlyReportIsLeft() const;
     std::int16_t countList3() const;
     // Puts the whole order into List3 again; the pass skips what has arrived.
     void refill();
@@ -27,6 +29,8 @@ public:
     // counts as broken.
     void stopNow();
     void leave();
+    // Each second: ends a pass or a check whose line is silent.
+    void watch();
 
     // Up to four attempts, each a pass and a check. The end of the sending; no value when the customer has left.
     std::optional<SendingPhase> RunAttempts();
@@ -63,10 +67,12 @@ private:
     // True when the count of the last check allows a verdict of missing files.
     bool lacksFiles() const;
     SendingPhase changedEnd();
+    SendingPhase unheardEnd() const;
 
     class FourAttempts;
     class OlderRounds;
 
+    const TransferState& m_transfer;
     const Platform& m_platform;
     SendingEvents& m_events;
 };

@@ -313,8 +313,14 @@ bool FtpSession::EnterOrderFolder() {
 }
 
 bool FtpSession::FtpMakeOrderDir(const QString& name) {
+    // A program that ends before the answer comes finds the folder there, and takes it for its own.
+    if (m_journal)
+        keep(m_journal->folderIsAsked());
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
+        if (m_journal &&
+            (made.failure().kind == Failure::Kind::Refused || made.failure().kind == Failure::Kind::AccessDenied))
+            keep(m_journal->folderIsRefused());
         trouble(LineStep::OrderFolder, made.failure());
         log(u" make remotedir fail"_s);
         return false;
@@ -323,6 +329,12 @@ bool FtpSession::FtpMakeOrderDir(const QString& name) {
     ListRemoteChecked();
     FillListFromNames(Target::List2, name);
     return true;
+}
+
+// Of a chosen part the count would tell nothing of the order.
+void FtpSession::countFiles(int sent) {
+    if (m_journal && m_transfer.SugMishloah == Sending::NewOrder)
+        m_journal->countFiles(sent, m_lists.List4Makor.count());
 }
 
 bool FtpSession::FtpSendFile(const QString& path) {

@@ -69,6 +69,8 @@ public:
     // Puts one file, whose name stands in the order's state until the put is confirmed. A failed put is added to
     // LogList, List7 and List4Broken. False without a session, too.
     bool FtpSendFile(const QString& path);
+    // So many files of the order were put well or skipped.
+    void countFiles(int sent);
     // Writes List4Broken to kashloo.txt. A failed write is told once a pass.
     void keepBrokenFiles();
     // Errors are ignored: the file is often not there.

@@ -8,6 +8,7 @@
 #include "order/OrderLog.h"
 #include "platform/Machine.h"
 #include "platform/files/Files.h"
+#include "platform/line/Internet.h"
 #include "transfer/delivery/OrderFiles.h"
 
 #include <algorithm>
@@ -38,10 +39,42 @@ constexpr int filterWalks = 3;
 
 } // namespace
 
+void UploadCheck::begin() {
+    m_silence.begin(SilenceLimit::Work::Check);
+    m_silent = false;
+    m_running = true;
+}
+
+bool UploadCheck::endSilent() {
+    m_running = false;
+    if (!m_silent || m_stop.left)
+        return false;
+    m_session.closeSession();
+    m_stop.StopFlag = false;
+    m_events.failed(LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent during the check"_s});
+    return true;
+}
+
+// By the way of a stop, which ends whatever is under way.
+void UploadCheck::beSilent() {
+    m_silent = true;
+    m_stop.StopFlag = true;
+}
+
+void UploadCheck::watch() {
+    if (!m_running || m_silent || m_stop.StopFlag)
+        return;
+    m_silence.moved(m_platform.internet.bytesMoved(), m_platform.clock.now());
+    if (!m_silence.over())
+        return;
+    beSilent();
+    m_platform.internet.abort();
+}
+
 void UploadCheck::check(int attempt) {
     m_freshListing = false;
     for (const Step step : stepsOf(attempt)) {
-        if (m_stop.left)
+        if (m_stop.left || m_silent)
             return;
         switch (step) {
         case Step::Pause:
@@ -73,6 +106,9 @@ void UploadCheck::freshConnection() {
     m_pump.pump();
     m_session.PauseBar(3);
     m_session.walkToLabFolder();
+    m_silence.connectsTimedOut(m_session.connectTimedOut);
+    if (m_running && m_silence.over() && !m_stop.StopFlag)
+        beSilent();
 }
 
 bool UploadCheck::lookUp() {
@@ -134,7 +170,7 @@ void UploadCheck::ListServerFiles() {
     m_session.FtpCloseConnection();
 }
 
-// Before the connection leaves the folder.
+// The connection still stands in the folder.
 void UploadCheck::prove() {
     proof = m_session.prove(m_lists.List4Makor.items());
     if (proof && missing().isEmpty())
@@ -152,7 +188,7 @@ QStringList UploadCheck::restOfOrder() const {
 Arrival UploadCheck::orderThere() {
     const OrderFolder order(m_transfer.OrderFolder);
     const QStringList rest = restOfOrder();
-    // What an earlier sending has not confirmed may lie there by half.
+    // The server may hold only a part of a file that an earlier sending has not confirmed.
     const QStringList unconfirmed = m_session.journal()->state().filesInHand + ReadBrokenFiles(m_files, order);
     if (std::any_of(rest.begin(), rest.end(), [&](const QString& path) { return unconfirmed.contains(path); }))
         return Arrival::Part;

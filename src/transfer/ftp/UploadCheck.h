@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/Platform.h"
+#include "transfer/delivery/SilenceLimit.h"
 #include "transfer/ftp/FtpSession.h"
 #include "transfer/report/LabReport.h"
 
@@ -11,15 +12,23 @@ namespace lumora {
 // dates are not compared.
 class UploadCheck {
 public:
-    UploadCheck(const TransferState& transfer, const Platform& platform, SendingEvents& events, SendingStop& stop,
+    UploadCheck(const SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
                 FtpLists& lists, FtpSession& session)
-        : m_transfer(transfer)
+        : m_transfer(state.transfer)
+        , m_platform(platform)
         , m_files(platform.files)
         , m_pump(platform.pump)
         , m_events(events)
         , m_stop(stop)
         , m_lists(lists)
-        , m_session(session) {}
+        , m_session(session)
+        , m_silence(state) {}
+
+    // A check of an attempt begins and ends. True at the end where the server was silent for too long, which ended it.
+    void begin();
+    bool endSilent();
+    // Each second: ends a check whose line is silent.
+    void watch();
 
     // The steps of the check after attempt 1 to 4; they differ only in pauses and in closing the connection.
     void check(int attempt);
@@ -60,13 +69,19 @@ private:
     bool nothingBroken() const { return m_lists.List4Broken.isEmpty() || m_lists.List6.isEmpty(); }
     void freshConnection();
 
+    void beSilent();
+
     const TransferState& m_transfer;
+    const Platform& m_platform;
     const Files& m_files;
     EventPump& m_pump;
     SendingEvents& m_events;
     SendingStop& m_stop;
     FtpLists& m_lists;
     FtpSession& m_session;
+    SilenceLimit m_silence;
+    bool m_running = false;
+    bool m_silent = false;
     bool m_freshListing = false; // the last RecheckBroken has read List6
 };
 

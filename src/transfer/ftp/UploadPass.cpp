@@ -64,7 +64,6 @@ void UploadPass::watch() {
     m_platform.internet.abort();
 }
 
-// By the way of a stop, which ends whatever is under way.
 void UploadPass::endBy(SendingPhase end, LineStep step, const Failure& why) {
     m_end = end;
     m_endStep = step;
@@ -148,7 +147,7 @@ bool UploadPass::triedAll() const {
     return std::all_of(order.begin(), order.end(), [&](const QString& path) { return m_done.contains(path); });
 }
 
-// As built in the name tells it alone. Remains are what a put has left that was not confirmed.
+// As built in the name alone tells it. A put that was not confirmed may have left a part of its file.
 bool UploadPass::liesThere(const QString& path, const QString& name) {
     if (!m_lists.List6.contains(name))
         return false;
@@ -159,8 +158,7 @@ bool UploadPass::liesThere(const QString& path, const QString& name) {
         confirm(path);
         return true;
     }
-    // The server may still hold open the file of a broken connection; it accepts the name again after the remains are
-    // deleted.
+    // A server may still hold open the file of a broken connection; it accepts the name again once the file is deleted.
     m_session.remove(name);
     return false;
 }
@@ -171,12 +169,17 @@ void UploadPass::send(const QString& path) {
     if (liesThere(path, name)) {
         if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
             m_skipped += *length;
-        m_done += path;
+        isDone(path);
         m_events.reached(SendingMoment::Skipped);
     } else {
         put(path, name);
     }
     m_events.reached(SendingMoment::FileDone, CurrentIndex + 1);
+}
+
+void UploadPass::isDone(const QString& path) {
+    m_done += path;
+    m_session.countFiles(static_cast<int>(m_done.size()));
 }
 
 // The path leaves List4Broken.
@@ -202,7 +205,7 @@ void UploadPass::put(const QString& path, const QString& name) {
     }
     if (IsBroken(broken, name))
         confirm(path);
-    m_done += path;
+    isDone(path);
     if (!m_session.lineEndsChanged(path))
         return;
     broken.append(path);

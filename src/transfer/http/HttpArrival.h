@@ -48,7 +48,7 @@ public:
 
     // The prints that the order's log names and those of these names, where names are fewer; as built in, never.
     std::optional<OrderCompleteness> lacking(const OrderFolder& order, const QStringList& names) const;
-    // A file at least was proven by its name alone.
+    // True when the name alone proved at least one file.
     bool byNameOnly() const;
 
 private:

@@ -205,6 +205,8 @@ void HttpSender::post(const QString& path) {
     m_events.reached(SendingMoment::Answered);
     if (!m_script.failed()) {
         m_events.reached(SendingMoment::Posted, --m_left);
+        if (m_journal)
+            m_journal->countFiles(lists.List4Kvazim.count() - m_left, lists.List4Kvazim.count());
         return;
     }
     m_allPosted = false;
@@ -371,6 +373,10 @@ std::optional<bool> HttpSender::hasFolder(const QString& name) {
     const Result<QByteArray> answer = m_platform.internet.fetch(listScript(name));
     m_platform.pump.pump();
     return answer && !stopped() ? std::optional(!TellsUnknownFolder(AnsiCodePage::decode(*answer))) : std::nullopt;
+}
+
+bool HttpSender::onlyReportIsLeft() const {
+    return m_state.transfer.SugMishloah == Sending::NewOrder && m_journal && LabReport::isLeft(m_journal->state());
 }
 
 void HttpSender::keepArrival(SendingPhase end) {

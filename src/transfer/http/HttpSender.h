@@ -76,6 +76,8 @@ public:
     std::optional<bool> hasFolder(const QString& name);
     const OrderJournal* journal() const { return m_journal ? &*m_journal : nullptr; }
 
+    // The order is new, and an earlier run found that it arrived: only the lab was not told.
+    bool onlyReportIsLeft() const;
     // The sending has ended so: keeps what has arrived.
     void keepArrival(SendingPhase end);
     // The files of the folder lay on the server before anything was sent. True when the lab has yet to be told of the

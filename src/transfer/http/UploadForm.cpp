@@ -70,6 +70,11 @@ void UploadForm::refreshList() {
     Picture6.visible = false;
     m_sender.BuildOrderFileList();
     m_sender.stop.StopFlag = false;
+    // The lab may have taken its files away since.
+    if (m_sender.onlyReportIsLeft()) {
+        succeed();
+        return;
+    }
     m_busy = true;
     Q_EMIT changed();
     m_platform.pump.pump();
@@ -83,7 +88,6 @@ void UploadForm::refreshList() {
 void UploadForm::findMissing() {
     if (!idle())
         return;
-    m_refused = false;
     if (lists().List4Kvazim.isEmpty()) {
         enter(SendingPhase::NoOrder);
         return;
@@ -95,9 +99,8 @@ void UploadForm::findMissing() {
     const bool mayGo = mayBeSent(lists().List4Kvazim.items());
     if (m_sender.stop.left)
         return;
-    m_refused = !mayGo;
     if (!mayGo) {
-        enter(SendingPhase::NoOrder);
+        enter(SendingPhase::Refused);
         return;
     }
     m_busy = true;
@@ -197,12 +200,12 @@ void UploadForm::sendMissing() {
     if (!end)
         return;
     Label4File.text.clear();
+    m_sender.keepArrival(*end);
     switch (*end) {
     case SendingPhase::Success:
         succeed();
         return;
     case SendingPhase::AllThere:
-        m_sender.keepArrival(*end);
         endAllThere();
         return;
     case SendingPhase::NumberTaken:
@@ -253,7 +256,6 @@ void UploadForm::succeed() {
     m_attemptFailed = false;
     forgetReason();
     enter(SendingPhase::Reporting);
-    m_sender.keepArrival(SendingPhase::Success);
     m_sender.HttpPause(2);
     if (!m_sender.stop.left)
         tellLab();

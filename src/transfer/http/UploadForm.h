@@ -110,7 +110,6 @@ private:
     Ticker Timer2;     // 1000 ms: the countdown
     Ticker Timer4Line; // 1000 ms: the watch over the line
     HttpSender m_sender;
-    bool m_refused = false;                     // the customer or a guard did not let the order leave
     bool m_busy = false;                        // a check outside an attempt runs
     bool m_attemptFailed = false;               // an attempt of this sending has left files behind
     std::optional<int> m_left;                  // files that have not arrived, once they are counted

@@ -43,6 +43,12 @@ std::span<const PhaseLook> UploadForm::looks() const {
                   {NewOrder, Close, Refresh},
                   notCompleteTitle,
                   noOrderAdvice},
+        PhaseLook{SendingPhase::Refused,
+                  SendingSign::Bad,
+                  NewOrder,
+                  {NewOrder, Close, Refresh},
+                  notCompleteTitle,
+                  refusedAdvice},
         PhaseLook{SendingPhase::NoServer,
                   SendingSign::Bad,
                   NewOrder,
@@ -88,7 +94,7 @@ QString UploadForm::advice(const PhaseLook& row) const {
         return wording(fewerArrived)
             .arg(std::min(m_lacking->present, m_lacking->marked))
             .arg(m_lacking->named.value_or(0));
-    return wording(row.phase == SendingPhase::NoOrder && m_refused ? refusedAdvice : row.advice);
+    return wording(row.advice);
 }
 
 void UploadForm::showPhase(const PhaseLook& row) {

@@ -46,8 +46,8 @@ bool LabReport::isDueWhereFound() const {
     return m_order && ReportOnce(m_state, m_platform.files, *m_order, m_stop).isDueWhereFound(m_by);
 }
 
-bool LabReport::isLeft() const {
-    return m_order && m_order->state().phase == Phase::Arrived && m_order->state().report == Report::NotYet;
+bool LabReport::isLeft(const OrderState& order) {
+    return order.phase == Phase::Arrived && order.report == Report::NotYet;
 }
 
 void LabReport::tell(ReportCalls& calls) {

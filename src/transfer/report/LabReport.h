@@ -11,6 +11,7 @@ namespace lumora {
 class OrderJournal;
 class ReportCalls;
 class ReportOnce;
+struct OrderState;
 struct Platform;
 struct SendingStop;
 
@@ -38,7 +39,7 @@ public:
     // yet to be told of it.
     bool isDueWhereFound() const;
     // The order has arrived, and only the lab was not told of it yet.
-    bool isLeft() const;
+    static bool isLeft(const OrderState& order);
 
     void tell(ReportCalls& calls);
     // For an operator, whatever was told before.
