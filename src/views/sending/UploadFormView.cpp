@@ -73,7 +73,8 @@ QPlainTextEdit* UploadFormView::answer(const Caption& caption) {
     made->setReadOnly(true);
     made->setFocusPolicy(Qt::NoFocus);
     made->setLayoutDirection(Qt::LeftToRight);
-    made->setMinimumHeight(theme().size(Extent::Drawing));
+    made->setMinimumHeight(theme().px(110));
+    made->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored);
     bindName(made, caption);
     return made;
 }
