@@ -102,7 +102,7 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Image5.visible = row.buttons.testFlag(SendAgain);
     Command2.visible = row.buttons.testFlag(Refresh);
     Command3.visible = row.buttons.testFlag(Hold);
-    Command15.enabled = row.buttons.testFlag(Stop);
+    Command15.visible = Command15.enabled = row.buttons.testFlag(Stop);
     Command10.visible = row.buttons.testFlag(GoOn);
     endClose.visible = row.buttons.testFlag(Close);
     Label11.visible = row.phase == SendingPhase::AllThere && !m_lacking;
@@ -154,6 +154,7 @@ void UploadForm::setTexts() {
     setCaptions(m_state, {{Command2, u"רענן רשימה", u"Refresh list"},
                           {Command3, u"עצור את המשלוח", u"Stop the sending"},
                           {Command10, u"המשך את המשלוח", u"Continue the sending"},
+                          {Command15, u"עצור", u"Stop"},
                           {Command28, u"הזמנה חדשה", u"New order"},
                           {Image3, u"סגור", u"Close"},
                           {endClose, u"סגור", u"Close"},

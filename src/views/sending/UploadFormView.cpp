@@ -60,8 +60,9 @@ void UploadFormView::makeBars() {
     m_stop = button(c.Command3, Role::Secondary, &UploadForm::Command3_Click, u"pause"_s);
     QPushButton* goOn = button(c.Command10, Role::Main, &UploadForm::Command10_Click);
     QPushButton* again = button(c.Image5, Role::Main, &UploadForm::Image5_Click);
-    frame().addSecondaryActions(
-        {asMain(SendingButton::Hold, m_stop), button(c.endClose, Role::Secondary, &UploadForm::Image3_Click)});
+    frame().addSecondaryActions({asMain(SendingButton::Hold, m_stop),
+                                 button(c.Command15, Role::Secondary, &UploadForm::Command15_Click, u"stop"_s),
+                                 button(c.endClose, Role::Secondary, &UploadForm::Image3_Click)});
     frame().addMainActions(
         {asMain(SendingButton::NewOrder, button(c.Command28, Role::Secondary, &UploadForm::Command28_Click)),
          asMain(SendingButton::GoOn, goOn), asMain(SendingButton::SendAgain, again)});
