@@ -113,7 +113,7 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Image5.enabled = Command23.enabled = row.main == SendNow; // before that no order is listed
     if (!underWay && row.phase != SendingPhase::Preparing)
         Picture1.visible = false;
-    Pic4Blink.visible = row.sign == SendingSign::Seconds;
+    Pic4Blink.visible = row.sign == SendingSign::Seconds && row.phase != SendingPhase::Waiting;
     Command23.visible = row.buttons.testAnyFlags(SendingButtons(Hold) | GoOn);
     Command10.visible = row.buttons.testFlag(SendAgain);
     Command11.visible = Command11.enabled = row.buttons.testFlag(Close);

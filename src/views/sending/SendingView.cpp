@@ -22,7 +22,7 @@ SendingView::SendingView(SendingPage& page, const SessionState& state, const The
 }
 
 void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side) {
-    QVBoxLayout* progress = inColumn(Space::Small, {Item::room(), {m_gauge, 6, Qt::AlignCenter}});
+    QVBoxLayout* progress = inColumn(Space::Small, {Item::room(), {m_gauge, 0, Qt::AlignCenter}, Space::Wide});
     add(*progress, lines);
     add(*progress, {Item::room()});
     add(*progress, troubles);
