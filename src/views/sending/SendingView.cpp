@@ -58,7 +58,6 @@ void SendingView::addLabList(QGridLayout& to, const Caption& heading, const char
     setRole(made, "lab");
     made->setLayoutDirection(Qt::LeftToRight);
     made->setMinimumHeight(theme().px(110));
-    made->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored);
     bindList(QString::fromUtf16(name), rows, made, shown);
     QLabel* title = label(heading, "smallMuted");
     title->setBuddy(made);

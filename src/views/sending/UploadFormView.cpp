@@ -75,7 +75,6 @@ QPlainTextEdit* UploadFormView::answer(const Caption& caption) {
     made->setFocusPolicy(Qt::NoFocus);
     made->setLayoutDirection(Qt::LeftToRight);
     made->setMinimumHeight(theme().px(110));
-    made->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored);
     bindName(made, caption);
     return made;
 }
