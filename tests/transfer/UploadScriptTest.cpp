@@ -123,9 +123,6 @@ TEST(ServerListTest, AListMustNameTheFolderAndATotalAndNoWhereSayNot) {
     };
     for (const auto& c : cases)
         EXPECT_EQ(ReadServerAnswer(c.answer, folder).verdict, c.verdict) << c.answer.toStdString();
-    EXPECT_EQ(ListFileName(0), u"filelisthom.txt"_s);
-    EXPECT_EQ(ListFileName(3), u"filelisthom3.txt"_s);
-    EXPECT_EQ(ListFileName(4), QString());
 }
 
 } // namespace

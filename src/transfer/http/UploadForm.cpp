@@ -111,7 +111,7 @@ void UploadForm::findMissing() {
     if (m_sender.stop.left)
         return;
     if (end) {
-        enter(*end);
+        endIncomplete(*end);
         return;
     }
     if (!lists().List4Hossarim.isEmpty()) {
