@@ -3,13 +3,13 @@
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
 #include "finished/orders/MoogMeret.h"
+#include "order/CompletenessGuard.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 
-#include <algorithm>
 #include <utility>
 
 namespace lumora {
@@ -46,26 +46,14 @@ void MoogMeret::sendByMail() {
         beginWalk();
 }
 
-// An order without a picture does not leave, and one with fewer than its log names only if the customer wants it.
 bool MoogMeret::mayBeMailed() {
     QStringList marked;
     for (const QString& path : List1.items())
         marked += LeafName(path);
-    const OrderCompleteness counts = OrderCompleteness::read(m_platform.files, OrderFolder(m_files.folder()), marked);
-    m_walksWholeOrder = counts.verdict() == OrderCompleteness::Verdict::Whole;
-    if (!m_state.Careful)
-        return true;
-    if (counts.verdict() == OrderCompleteness::Verdict::None) {
-        tellNothingIsMarked(m_state.wording(u"אין בהזמנה זו אף תמונה להדפסה, ולכן לא נשלח דבר."_s,
-                                            u"This order holds no picture to print, so nothing is sent."_s));
-        return false;
-    }
-    return counts.verdict() != OrderCompleteness::Verdict::Fewer ||
-           (asks(u"לפי הרישום יש בהזמנה %1 תמונות, ורק %2 מהן יישלחו. לשלוח בכל זאת?",
-                 u"The order's log names %1 pictures, and only %2 of them would be sent. Send all the same?",
-                 {QString::number(counts.named.value_or(0)),
-                  QString::number(std::min(counts.present, counts.marked))}) &&
-            mayAct());
+    const OrderFolder order(m_files.folder());
+    m_walksWholeOrder =
+        OrderCompleteness::read(m_platform.files, order, marked).verdict() == OrderCompleteness::Verdict::Whole;
+    return CompletenessGuard(m_state, m_platform).maySend(order, marked) && mayAct();
 }
 
 // After a stop, with the same files marked, the customer chooses whether what was sent is sent again.

@@ -7,7 +7,7 @@
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "transfer/delivery/CompletenessGuard.h"
+#include "order/CompletenessGuard.h"
 #include "transfer/delivery/OrderFiles.h"
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"

@@ -18,7 +18,7 @@ public:
 
     enum class Work { Pass, Check };
     void begin(Work work = Work::Pass);
-    // A file of the pass is done with: did all its connects run into the time limit?
+    // After each file of a pass and each reconnect of a check. all: every try to connect ran into the time limit.
     void connectsTimedOut(bool all);
     // Told about once a second while the pass runs. bytes: a count that only grows, with what a skipped file has.
     void moved(qint64 bytes, const QDateTime& now);

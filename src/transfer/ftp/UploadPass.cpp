@@ -182,7 +182,7 @@ void UploadPass::isDone(const QString& path) {
     m_session.countFiles(static_cast<int>(m_done.size()));
 }
 
-// The path leaves List4Broken.
+// Takes the path out of List4Broken.
 void UploadPass::confirm(const QString& path) {
     TextList& broken = m_lists.List4Broken;
     for (int i = broken.lastIndex(); i >= 0; --i) {

@@ -9,8 +9,8 @@ struct OrderCompleteness;
 struct Platform;
 struct SessionState;
 
-// Asked before a sending begins: an order without a picture to print does not leave, and one that lacks pictures of its
-// log leaves only if the customer says so. As built in, every order leaves.
+// Asked before a sending begins, also by mail: an order without a picture to print does not leave, and one that lacks
+// pictures of its log leaves only if the customer says so. As built in, every order leaves.
 class CompletenessGuard {
 public:
     CompletenessGuard(const SessionState& state, const Platform& platform)

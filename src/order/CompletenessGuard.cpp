@@ -1,4 +1,4 @@
-#include "transfer/delivery/CompletenessGuard.h"
+#include "order/CompletenessGuard.h"
 
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"

@@ -1,8 +1,8 @@
+#include "order/CompletenessGuard.h"
 #include "order/OrderCompleteness.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
-#include "transfer/delivery/CompletenessGuard.h"
 
 #include <algorithm>
 
