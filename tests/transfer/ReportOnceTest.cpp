@@ -120,6 +120,10 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
 TEST_F(AReport, thatIsStoppedStaysBegun) {
     OrderJournal journal(test.files, folder);
     ASSERT_TRUE(journal.arrived(false));
+    stop.StopFlag = true;
+    EXPECT_EQ(ReportOnce(state, test.files, journal, stop).tell(Sender::Ftp, calls), Told::Cut);
+    EXPECT_TRUE(calls.heard.isEmpty() && kept().report == Report::NotYet) << "the next arrival tells";
+    stop.StopFlag = false;
     calls.onOrder = [&] { stop.StopFlag = true; };
     EXPECT_EQ(ReportOnce(state, test.files, journal, stop).tell(Sender::Ftp, calls), Told::Cut);
     EXPECT_EQ(calls.heard.size(), 1) << "no done call";

@@ -187,7 +187,9 @@ void FtpFrm::showFailure() {
     showSecondsAfterFailure();
 }
 
+// A stop that came too late for the sending is none of the telling.
 void FtpFrm::succeed() {
+    m_sender.stop.StopFlag = false;
     enter(SendingPhase::Reporting);
     for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
         control->visible = false;

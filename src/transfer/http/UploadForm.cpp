@@ -247,7 +247,9 @@ void UploadForm::endAllThere() {
     enter(SendingPhase::AllThere);
 }
 
+// A stop that came too late for the sending is none of the telling.
 void UploadForm::succeed() {
+    m_sender.stop.StopFlag = false;
     percent = 100;
     Label7.text = u"100"_s;
     caption = u"100%"_s;

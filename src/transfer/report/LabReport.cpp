@@ -55,13 +55,13 @@ void LabReport::tell(ReportCalls& calls) {
 }
 
 void LabReport::tellAgain(ReportCalls& calls) {
+    m_stop.StopFlag = false;
     run([&](ReportOnce& reports) { reports.tellAgain(calls); });
 }
 
 void LabReport::run(const std::function<void(ReportOnce&)>& telling) {
     if (!m_order || m_seconds)
         return;
-    m_stop.StopFlag = false;
     m_seconds = 0;
     ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
     {

@@ -63,6 +63,8 @@ ReportOnce::Told ReportOnce::tellAgain(ReportCalls& calls) {
 }
 
 ReportOnce::Told ReportOnce::request(ReportCalls& calls) {
+    if (isStopped())
+        return Told::Cut;
     const bool ofAnArrival = m_journal.state().phase >= Phase::Arrived || m_journal.state().report != Report::NotYet;
     if (ofAnArrival && !keep(m_journal.reportBegun()) && m_state.Careful)
         return Told::NotKept;

@@ -43,7 +43,7 @@ public:
         NotKnown,  // an earlier telling was begun, and its end is not known
         NotWanted, // the lab wants no report of this order, or not all of it has arrived
         NotKept,   // the begin could not be kept, so that no request went out
-        Cut,       // stopped or left in between: begun, and its end is not known
+        Cut,       // stopped or left: once it was begun, its end is not known
     };
     Told tell(Sender by, ReportCalls& calls);
     // Whatever was told before, for an operator who knows that the lab has heard nothing.
