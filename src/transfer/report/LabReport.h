@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Result.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/SendingPhase.h"
 
