@@ -1,5 +1,6 @@
 #include "transfer/delivery/SendingPage.h"
 
+#include "order/CompletenessGuard.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
 #include "platform/Dialogs.h"
@@ -7,7 +8,6 @@
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "order/CompletenessGuard.h"
 #include "transfer/delivery/OrderFiles.h"
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"
