@@ -27,6 +27,7 @@
 #include <QListWidget>
 #include <QPainter>
 #include <QPushButton>
+#include <QScrollArea>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -329,6 +330,15 @@ QStringList Walk::faults() {
         result += u"the page runs the other way"_s;
     if (english && hasHebrew(window.windowTitle()))
         result += u"a Hebrew title"_s;
+    for (const auto* area : root->findChildren<QScrollArea*>()) {
+        const auto parts = area->widget()->findChildren<QWidget*>(Qt::FindDirectChildrenOnly);
+        for (auto at = parts.begin(); at != parts.end(); ++at) {
+            for (auto other = parts.begin(); other != at; ++other) {
+                if ((*at)->isVisible() && (*other)->isVisible() && (*at)->geometry().intersects((*other)->geometry()))
+                    result += u"%1 lies over %2"_s.arg(nameOf(**at), nameOf(**other));
+            }
+        }
+    }
     for (const QWidget* widget : root->findChildren<QWidget*>()) {
         if (!widget->isVisible() || widget->size().isEmpty())
             continue;
