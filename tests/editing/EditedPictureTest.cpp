@@ -98,7 +98,7 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         {"upright.png", {13, 18}, "1   1.3 1   27080 130 217 1  0  000"},
         {"upright.png",
          {13, 18},
-         "1   1   1   187120150 207 0  0  000000000000          302 1 0 1 ddd       0  2552550  300"
+         "1   1   1   187120150 207 0  0  000000000000          302 1 0 1 ddd       0  255255280300"
          "0  0 3 DejaVu Sans                   Lumora 2024"},
         {"upright.png", {10, 15}, "1   1   1.3 27080 130 217 1  0  cd 000000000blue"},
         {"upright.png",
@@ -112,6 +112,10 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
         const Bitmap full = print(given.file, edit, given.paper);
         ASSERT_FALSE(seen.isNull() || full.isNull()) << given.record;
         EXPECT_LE(differenceOf(seen, full), 3.0) << given.record;
+        EditFields bare = edit;
+        bare.TextOn = 0;
+        EXPECT_TRUE(edit.TextOn == 0 || print(given.file, bare, given.paper).image() != full.image()) << given.record;
+        EXPECT_TRUE(edit.TextOn == 0 || preview(given.file, bare, given.paper).image() != seen.image()) << given.record;
     }
     // What the measure is worth: a print that is moved, turned or toned a little differently is told from the preview.
     const auto differs = [&](const char* record) {
