@@ -50,6 +50,10 @@ bool HistoryState::contains(const DrivePath& folder) const {
     return std::any_of(orders.begin(), orders.end(), [&](const OrderFolder& order) { return order.path() == folder; });
 }
 
+bool HistoryState::areGuarded(const SessionState& state) const {
+    return state.Careful && count() > 0;
+}
+
 Result<void> HistoryState::markLegacyArrived(const Files& files) const {
     for (const OrderFolder& folder : legacy) {
         if (Result<void> marked = OrderJournal(files, folder).needsNoReport(); !marked)

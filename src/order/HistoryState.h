@@ -31,6 +31,8 @@ struct HistoryState {
     // All that are not proven to lie on a server.
     int count() const { return static_cast<int>(notProven.size() + station.size() + mail.size()); }
     bool contains(const DrivePath& folder) const;
+    // True where a clean-up asks before it removes their print files; as built in it removes them.
+    bool areGuarded(const SessionState& state) const;
 
     // Counts the orders of an earlier version as arrived from now on.
     Result<void> markLegacyArrived(const Files& files) const;

@@ -40,10 +40,12 @@ bool SenderSetUp(const ClientProfile& profile, Sender sender) {
     return !profile.FtpUser.isEmpty() && !profile.FtpServer.isEmpty() && !profile.FtpPassword.isEmpty();
 }
 
-Sender SenderForResend(const ClientProfile& profile, const OrderFolder& folder, const Files& files) {
+Sender SenderForResend(const SessionState& state, const OrderFolder& folder, const Files& files) {
+    if (!state.Careful)
+        return state.transfer.SugSheliach;
     const Sender made = SenderMadeFor(files, folder).value_or(Sender::Ftp);
     const Sender other = made == Sender::Ftp ? Sender::Http : Sender::Ftp;
-    return !SenderSetUp(profile, made) && SenderSetUp(profile, other) ? other : made;
+    return !SenderSetUp(state.profile, made) && SenderSetUp(state.profile, other) ? other : made;
 }
 
 } // namespace lumora

@@ -16,7 +16,8 @@ std::optional<Sender> SenderMadeFor(const Files& files, const OrderFolder& folde
 // True when the lab has given all that the sender needs to reach its server.
 bool SenderSetUp(const ClientProfile& profile, Sender sender);
 
-// The sender that the order was made for where that is set up, else the one that is.
-Sender SenderForResend(const ClientProfile& profile, const OrderFolder& folder, const Files& files);
+// The sender that a finished order is sent again by: as built in that of the session, else the one that the order was
+// made for where that is set up, else the one that is.
+Sender SenderForResend(const SessionState& state, const OrderFolder& folder, const Files& files);
 
 } // namespace lumora

@@ -153,11 +153,13 @@ TEST_F(AJournal, tellsBySenderAndSheetHowAnOrderIsSentAgain) {
             state.way = *one.way;
             ASSERT_TRUE(WriteOrderState(test.files, order, state));
         }
-        ClientProfile profile;
+        SessionState session;
+        session.Careful = true;
+        ClientProfile& profile = session.profile;
         profile.FtpServer = profile.FtpUser = profile.FtpPassword = one.ftpSetUp ? u"set"_s : QString();
         profile.HttpHost = one.httpSetUp ? u"http://lab"_s : QString();
         EXPECT_EQ(SenderMadeFor(test.files, order), one.made) << one.what;
-        EXPECT_EQ(SenderForResend(profile, order, test.files), one.resend) << one.what;
+        EXPECT_EQ(SenderForResend(session, order, test.files), one.resend) << one.what;
     }
 }
 

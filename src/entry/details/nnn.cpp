@@ -409,7 +409,7 @@ void nnn::cleanHistory() {
     if (!before.legacy.isEmpty() && asksToMarkLegacy(before))
         succeeded(before.markLegacyArrived(m_platform.files));
     const HistoryState history = HistoryState::of(m_state, m_platform.files);
-    const bool keeps = m_state.Careful && history.count() > 0 && !asksToCleanNotProven(history);
+    const bool keeps = history.areGuarded(m_state) && !asksToCleanNotProven(history);
     if (m_leaving)
         return;
     Workspace(m_state, m_platform.files).CleanHistory([&](const DrivePath& folder) {

@@ -270,10 +270,7 @@ void MoogMeret::sendAgain() {
     enter(Phase::Leaving);
     m_state.transfer.SugMishloah = Sending::Resend;
     m_state.transfer.OrderFolder = m_files.folder();
-    const Sender by = m_state.Careful
-                          ? SenderForResend(m_state.profile, OrderFolder(m_files.folder()), m_platform.files)
-                          : m_state.transfer.SugSheliach;
-    const bool byHttp = by == Sender::Http;
+    const bool byHttp = SenderForResend(m_state, OrderFolder(m_files.folder()), m_platform.files) == Sender::Http;
     if (!byHttp)
         m_state.handOver.lines = List1.items();
     m_chain.follow(PageId::MoogMeret, byHttp ? Outcome::ResentByHttp : Outcome::ResentByFtp);
