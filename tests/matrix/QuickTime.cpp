@@ -1,6 +1,6 @@
 // Loaded in front of a program by LD_PRELOAD. Its monotonic clock, its waits and the limits of its sockets run
 // MATRIX_CLOCK times as fast; at rename MATRIX_KILL the program is killed, before it or, if the number is negative,
-// behind it.
+// behind it. The targets of all renames are written to the file MATRIX_RENAMES, a line each.
 #include <dlfcn.h>
 #include <poll.h>
 #include <sys/epoll.h>
@@ -24,6 +24,7 @@ long number(const char* name) {
 }
 const long hurry = std::max(1L, number("MATRIX_CLOCK"));
 const long killAt = number("MATRIX_KILL");
+const char* const renamesFile = std::getenv("MATRIX_RENAMES");
 std::atomic<long> renames = 0;
 constexpr long second = 1'000'000'000;     // nanoseconds
 constexpr time_t calendar = 1'000'000'000; // seconds; a later deadline is one of the calendar's clock
@@ -94,6 +95,10 @@ int rename(const char* from, const char* to) noexcept {
     if (count == killAt)
         raise(SIGKILL);
     const int failed = next<decltype(rename)>("rename")(from, to);
+    if (std::FILE* file = renamesFile ? std::fopen(renamesFile, "a") : nullptr) {
+        std::fprintf(file, "%s\n", to);
+        std::fclose(file);
+    }
     if (count == -killAt)
         raise(SIGKILL);
     return failed;

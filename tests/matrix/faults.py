@@ -17,7 +17,7 @@ class Fault:
         self.clock = more.pop('clock', 10)      # how many times as fast the program's clock runs
         self.limit = more.pop('limit', 150)      # seconds here until the program hangs
         self.only = more.pop('only', ())        # the servers that it is played before; none: all
-        self.again = more.pop('again', False)   # what the program is told makes it send again what is there
+        self.again = more.pop('again', 0)       # so many files may be sent though they are there: what the program is told makes it so
         self.literal = more.pop('literal', '')  # why a lie stays even with Careful
         self.quick = more.pop('quick', False)   # also in ./test
         self.as_installed = more.pop('as_installed', False)  # the server changes files under TYPE A, and the lab has not set I
@@ -210,20 +210,20 @@ FTP = [
     Fault('data and control line cut', {'STOR': (passed(cut=20_000, answer=lambda text: ''), 1, PRINT)}),
     Fault('data line cut, DELE refused',
           {'STOR': (passed(cut=20_000), 1, PRINT), 'DELE': reply('550 Permission denied')}),
-    Fault('226 lost, once', {'STOR': (closing(''), 1, PRINT)}, again=True, quick=True),
-    Fault('226 lost, always', {'STOR': (closing(''), ALWAYS, PRINT)}, again=True),
+    Fault('226 lost, once', {'STOR': (closing(''), 1, PRINT)}, quick=True),
+    Fault('226 lost, always', {'STOR': (closing(''), ALWAYS, PRINT)}),
     Fault('silence behind 150', {'STOR': (passed(stall=0), 1, PRINT)}, clock=20),
     Fault('silence in mid-file', {'STOR': (passed(stall=20_000), 1, PRINT)}, clock=20),
-    Fault('silence before 226', {'STOR': (hang_before_the_end, 1, PRINT)}, clock=20, again=True),
+    Fault('silence before 226', {'STOR': (hang_before_the_end, 1, PRINT)}, clock=20),
     # a full server
     Fault('disk full from the third file on', {'STOR': (passed(cut=20_000, answer=lambda text: '452 No space'), ALWAYS, PRINT)}),
-    Fault('451 behind the data, once', {'STOR': (closing('451 Failure writing to local file'), 1, PRINT)}, again=True),
+    Fault('451 behind the data, once', {'STOR': (closing('451 Failure writing to local file'), 1, PRINT)}),
     Fault('552 behind the data, the file gone', {'STOR': (then_gone('552 Quota exceeded'), ALWAYS, PRINT)}),
     Fault('552 behind the data, the file gone, once', {'STOR': (then_gone('552 Quota exceeded'), 1, PRINT)}),
     # a put that is answered well
     Fault('226, the file is empty', {'STOR': (passed(change=lambda content: b''), 1, PRINT)}),
     Fault('226, the file is half', {'STOR': (passed(change=half), 1, PRINT)}, quick=True),
-    Fault('226, the file is half, always', {'STOR': (passed(change=half), ALWAYS, PRINT)}),
+    Fault('226, the file is half, always', {'STOR': (passed(change=half), ALWAYS, PRINT)}, literal='it is proven by its name'),
     Fault('226, the last byte is missing', {'STOR': (passed(change=lambda content: content[:-1]), 1, PRINT)}),
     Fault('226, the file is half, SIZE refused',
           {'STOR': (passed(change=half), 1, PRINT), 'SIZE': reply('550 SIZE not allowed in ASCII mode')}),
@@ -240,8 +240,8 @@ FTP = [
     Fault('names in small letters', {'STOR': stored_as(str.lower)}, heals=False),
     Fault('"^" stored as "_"', {'STOR': stored_as(lambda name: name.replace('^', '_'))}, heals=False),
     # listings
-    Fault('listing cut in half, once', {'LIST': (passed(change=half), 1, MIDDLE)}, again=True, quick=True),
-    Fault('listing empty, once', {'LIST': (passed(change=lambda content: b''), 1, MIDDLE)}, again=True),
+    Fault('listing cut in half, once', {'LIST': (passed(change=half), 1, MIDDLE)}, quick=True),
+    Fault('listing empty, once', {'LIST': (passed(change=lambda content: b''), 1, MIDDLE)}),
     Fault('listing reset, once', {'LIST': (passed(cut=40), 1, MIDDLE)}),
     Fault('listing refused, once', {'LIST': (reply('425 Failed to establish connection'), 1, MIDDLE)}),
     Fault('listing refused from the middle on', {'LIST': (reply('550 no'), ALWAYS, MIDDLE)}),
@@ -319,10 +319,38 @@ def of_list(add):
     return act
 
 
+def slowly(rate):
+    """A server that takes so many bytes of a file a second."""
+    def act(session):
+        left = int(session.headers['Content-Length'])
+        session.body = b''
+        while left and (piece := session.rfile.read1(min(left, max(rate // 10, 1)))):
+            session.body += piece
+            left -= len(piece)
+            time.sleep(len(piece) / rate)
+    return act
+
+
+def stray_file(session):
+    session.server.lab.put_stray()
+
+
+def half_and_drop(session):
+    session.store(half)
+    drops(session)
+
+
+def other_length(session):
+    path = session.server.root / session.path.partition('/uploads/')[2].replace('%20', ' ')
+    return session.answer(b'', length=path.stat().st_size + 7) or True if path.is_file() else False
+
+
 # The first list is asked for before anything is sent.
 FIRST = 2
 HTTP = [
     Fault('no fault', quick=True),
+    Fault('nobody listens', host='closed'),
+    Fault('a black hole', host='blackhole', clock=60),
     Fault('half of a file stored, once', {'POST': (stored(half), 1, 2)}, quick=True),
     Fault('half of a file stored, always', {'POST': (stored(half), ALWAYS, 2)}),
     Fault('an empty file stored', {'POST': (stored(lambda content: b''), 1, 2)}),
@@ -333,31 +361,43 @@ HTTP = [
     Fault('500, once', {'POST': (says(b'', 500), 1, 2)}),
     Fault('500, always', {'POST': says(b'', 500)}),
     Fault('POST: silence, once', {'POST': (silent, 1, 2)}, clock=20, limit=120),
+    Fault('POST: silence, always', {'POST': silent}, clock=60),
+    Fault('POST: 0.3 kB/s for ever', {'READ': slowly(20_000)}, clock=60),
+    Fault('POST: half stored, line cut, once', {'POST': (half_and_drop, 1, 2)}),
+    Fault('POST: half stored, line cut, once, and no HEAD', {'POST': (half_and_drop, 1, 2), 'HEAD': says(b'', 405)}),
+    Fault('POST: an answer shorter than it says, once', {'POST': (lambda session: session.store() or session.answer(b'sto', length=90)
+                                                                  or drops(session), 1, 2)}),
     Fault('POST: line cut, once', {'POST': (drops, 1, 2)}),
     Fault('POST: stored, line cut, once', {'POST': (stores_and_drops, 1, 2)}),
     Fault('POST: redirect 302', {'POST': redirects(302)}),
     Fault('POST: redirect 307', {'POST': redirects(307)}),
-    Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}, again=True),
-    Fault('list script: 500, always', {'MAKELIST': (says(b'', 500), ALWAYS, FIRST)}, again=True),
-    Fault('list script: silence, once', {'MAKELIST': (silent, 1, FIRST)}, clock=20, limit=120, again=True),
+    Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}),
+    Fault('list script: 500, always', {'MAKELIST': (says(b'', 500), ALWAYS, FIRST)}),
+    Fault('list script: silence, once', {'MAKELIST': (silent, 1, FIRST)}, clock=20, limit=120),
     Fault('list script: redirect', {'MAKELIST': redirects(302)}),
     Fault('list with ".", a file not stored',
           {'MAKELIST': lists(lambda entries: [*entries[:-1], '.', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 5)}),
     Fault('list with parts of names, files not stored',
           {'MAKELIST': lists(lambda entries: [*entries[:-1], 'jpp', 'jpp', 'txt', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 3)}),
     Fault('list with names in capitals', {'MAKELIST': lists(lambda entries: [*entries[:1], *map(str.upper, entries[1:-1]), entries[-1]])}),
-    Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}, again=True),
-    Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}, again=True),
-    Fault('list lacks a file, once', {'MAKELIST': (lists(lambda entries: [*entries[:2], *entries[3:]]), 1, FIRST)}, again=True),
+    Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}),
+    Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}),
+    Fault('list lacks a file, once', {'MAKELIST': (lists(lambda entries: [*entries[:2], *entries[3:]]), 1, FIRST)}, again=1),
     Fault('list: redirect', {'FETCH': lambda session: session.answer(b'', 302, Location=session.path + '?again') or True
                              if '?' not in session.path else False}),
-    Fault('list: 404, once', {'FETCH': (says(b'no such file', 404), 1, 4)}, again=True),
-    Fault('list: 404, always', {'FETCH': says(b'no such file', 404)}, again=True),
-    Fault('list: a page of words, 200', {'FETCH': (says(b'<html>This site is being worked on. Please come back.</html>'), 2, 3)}, again=True),
-    Fault('list without end', {'FETCH': (without_end, 2, 3)}, again=True, limit=120),
-    Fault('list: Content-Length too large', {'FETCH': (of_list(add=100), 2, 3)}, again=True, quick=True),
-    Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}, again=True),
+    Fault('list: 404, once', {'FETCH': (says(b'no such file', 404), 1, 4)}),
+    Fault('list: 404, always', {'FETCH': says(b'no such file', 404)}),
+    Fault('list: a page of words, 200', {'FETCH': (says(b'<html>This site is being worked on. Please come back.</html>'), 2, 3)}),
+    Fault('list without end', {'FETCH': (without_end, 2, 3)}, limit=120),
+    Fault('list: Content-Length too large', {'FETCH': (of_list(add=100), 2, 3)}, quick=True),
+    Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}),
     Fault('no HEAD', {'HEAD': says(b'', 405)}),
+    Fault('HEAD: 404', {'HEAD': says(b'', 404)}),
+    Fault('HEAD: line cut, once', {'HEAD': (drops, 1, 2)}),
+    Fault('HEAD: silence', {'HEAD': silent}, clock=60),
+    Fault('HEAD tells another length, once', {'HEAD': (other_length, 1, 2)}, again=1),
+    Fault('HEAD tells another length, always', {'HEAD': other_length}, again=10),
+    Fault('a stray file in the folder', {'POST': (stray_file, 1, 2)}, quick=True),
     Fault('no HEAD, half of a file stored', {'HEAD': says(b'', 405), 'POST': (stored(half), 1, 2)}, literal='no length is to be had'),
     Fault('another order in the folder', {'MAKELIST': (foreign_folder, 1)}),
     Fault('report: 500', {'REPORT': says(b'', 500), 'DONE': says(b'', 500)}),

@@ -31,6 +31,7 @@ class Relay:
         self.puts, self.confirmed = [], set()    # puts: name, whether the server held it whole and had said so
         self.open = []
         self.listener, self.port = listen(host)
+        self.ended = threading.Event()
         in_background(self.accept)
 
     def accept(self):
@@ -42,6 +43,7 @@ class Relay:
             in_background(Session(self, connection).run)
 
     def stop(self):
+        self.ended.set()
         drop(self.listener, False)
 
     def due(self, word):
@@ -128,9 +130,10 @@ class Session:
             return f'229 Entering Extended Passive Mode (|||{port}|)'
         return f'227 Entering Passive Mode (127,0,0,1,{port // 256},{port % 256})'
 
-    def transfer(self, line, answer, change=None, cut=None, stall=None, rate=None, linger=0, reset_server=True):
+    def transfer(self, line, answer, change=None, cut=None, stall=None, rate=None, linger=0, reset_server=True, dies=None):
         """change: of all the bytes; cut: the data line breaks after so many of them; stall: nothing moves any more after so many;
-        rate: bytes a second; linger: seconds until the data line of a listing ends in the server's mind."""
+        rate: bytes a second; linger: seconds until the data line of a listing ends in the server's mind; dies: ends the program, of which
+        the server hears nothing."""
         inwards = line[:4].upper() == 'STOR'
         far = socket.create_connection(('127.0.0.1', self.data_port))
         self.server.tell(line)
@@ -167,6 +170,9 @@ class Session:
             else:
                 if change:
                     target.sendall(change(whole))
+                if dies:
+                    dies()
+                    self.relay.ended.wait()
                 if linger and not inwards:
                     self.linger(near, linger)
                 drop(far, False)

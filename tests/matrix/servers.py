@@ -232,6 +232,8 @@ class WebLab(socketserver.ThreadingMixIn, http.server.HTTPServer):
         self.asked, self.puts, self.confirmed = [], [], set()
         super().__init__(('127.0.0.1', 0), WebSession)
         self.port = self.server_address[1]
+        if 'READ' in acts:
+            self.socket.setsockopt(socket.SOL_SOCKET, socket.SO_RCVBUF, 8192)
         in_background(self.serve_forever, 0.05)
 
     def handle_error(self, request, client_address):
@@ -265,7 +267,11 @@ class WebSession(http.server.BaseHTTPRequestHandler):
         if self.command == 'HEAD' and route == 'FETCH':
             route = 'HEAD'
         self.server.asked.append((route, self.path))
-        self.body = self.rfile.read(int(self.headers.get('Content-Length') or 0))
+        slow = self.server.acts.get('READ') if route == 'POST' else None
+        if slow and slow.due():
+            slow.do(self)
+        else:
+            self.body = self.rfile.read(int(self.headers.get('Content-Length') or 0))
         act = self.server.acts.get(route)
         name = self.sent_file()[0] if route == 'POST' else None
         if name:

@@ -90,6 +90,8 @@ protected:
                 GTEST_SKIP() << "no LUMORA_FTP_SERVER is given";
             ASSERT_EQ(login.size(), 4);
             account = toHostPath(login[3]);
+            for (const auto& left : fs::directory_iterator(account / "zalamim234"))
+                fs::remove_all(left.path());
             break;
         }
     }
