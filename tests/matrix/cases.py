@@ -124,6 +124,7 @@ class Case:
         self.arrived = self.folder / ('account/' + ACCOUNT if way == 'ftp' else 'uploads')
         self.foreign = self.first_proof = self.ftp = self.relay = self.pictures = None
         self.order_of = 'plain' if way == 'ftp' else 'edited'   # the scenario
+        self.count = PICTURES
 
     # --- the two ends
 
@@ -266,7 +267,7 @@ class Case:
             return []
         names = [order.name for workspace in self.workspaces() for order in workspace.orders()]
         texts = [re.sub('|'.join(map(re.escape, names)), 'ORDER', text) for text in orders]
-        usual = self.tools.reports.setdefault((self.way, self.order_of), texts[-1])
+        usual = self.tools.reports.setdefault((self.way, self.order_of, self.count), texts[-1])
         return ['another report than that of a new order'] if any(text != usual for text in texts) else []
 
     def run(self):
