@@ -190,7 +190,7 @@ FTP = [
     Fault('another order comes behind the listing', {'MKD': (foreign_order_meanwhile, 1)}, only=('scripted',)),
     Fault('a stray file in the folder', {'STOR': (put_stray, 1, 2)}, quick=True),
     # the data line
-    Fault('no EPSV', no_epsv()),
+    Fault('no EPSV', no_epsv(), quick=True),
     Fault('no EPSV, PASV with a foreign address',
           no_epsv(passed(answer=lambda text: text.replace('127,0,0,1', '192,0,2,7')), '522 not for this network')),
     Fault('no EPSV, PASV without parentheses', no_epsv(passed(answer=without_parentheses))),

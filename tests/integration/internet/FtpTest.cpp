@@ -268,16 +268,6 @@ TEST_F(FtpTest, FailsAtOnceWhereNobodyListensAndWithinTheLimitWhereNobodyAnswers
     EXPECT_EQ(mute.failure().kind, Failure::Kind::TimedOut);
 }
 
-TEST_F(FtpTest, FallsBackToPasvWhereEpsvIsRefused) {
-    relay.setFaults({.command = "EPSV", .reply = "500 Unknown command"});
-    auto ftp = connect();
-    ASSERT_TRUE(ftp);
-    ASSERT_TRUE(ftp->put(write(local, "x", "x"), u"x.jpp"_s));
-    EXPECT_TRUE(ftp->list(u"*.*"_s));
-    EXPECT_EQ(relay.commands().count("EPSV"), 1);
-    EXPECT_EQ(relay.commands().count("PASV"), 2);
-}
-
 // What a put answers to each fault of the line; where the server can still tell of a cut, it is the server that
 // refuses. A fresh connection is good again behind each.
 TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
