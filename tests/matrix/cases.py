@@ -122,6 +122,7 @@ class Case:
         self.folder = tools.scratch / f'{number:04}'
         self.mine = Workspace(self.folder, tools, way)
         self.arrived = self.folder / ('account/' + ACCOUNT if way == 'ftp' else 'uploads')
+        self.allowed = []    # what is told and does not fail
         self.foreign = self.first_proof = self.ftp = self.relay = self.pictures = None
         self.order_of = 'plain' if way == 'ftp' else 'edited'   # the scenario
         self.count = PICTURES
@@ -241,10 +242,10 @@ class Case:
 
     def beside(self, reports):
         """What must not be, whatever the verdict: too many puts, names that have no business there, too many or few reports."""
-        found = []
+        found, self.allowed = [], []
         twice = sum(already for _, already in (self.relay or self.web).puts)
-        if twice > self.fault.again:
-            found.append(f'{twice} sent twice')
+        if twice:
+            (found if twice > self.fault.again else self.allowed).append(f'{twice} sent twice')
         theirs = {path.name for path in self.foreign or {}}
         there = {path.name for path in self.arrived.glob('*/*') if not path.name.startswith('filelist')}
         aliens = sorted(there - set(self.mine.files()) - theirs - {STRAY})
@@ -279,11 +280,11 @@ class Case:
         finally:
             self.tools.playing.remove(self)
             self.close()
-        self.text = '; '.join([self.result, *self.found])
+        self.text = '; '.join([self.result, *self.allowed, *self.found])
         self.seconds = time.time() - self.begun
         lie = 'LIE' in self.text or SMALL in self.text or 'no report' in self.text
         self.good = not self.found and not re.search('STILL|EARLY|by resend (told|whole)', self.text) and \
-            (not lie or bool(self.fault.literal)) and (not self.survived() or self.text == 'arrived whole')
+            (not lie or bool(self.fault.literal)) and (not self.survived() or self.result == 'arrived whole')
         if self.good:
             shutil.rmtree(self.folder, ignore_errors=True)
         return self

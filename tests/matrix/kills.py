@@ -111,7 +111,7 @@ class Kill(Case):
 
     def run(self):
         super().run()
-        self.good = self.text in GOOD
+        self.good = self.result in GOOD and not self.found
         return self
 
     def play_case(self):

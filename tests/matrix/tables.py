@@ -31,8 +31,8 @@ def kill_table(results):
     def ends(chosen):
         counts = {}
         for case in chosen:
-            counts.setdefault(case.text, []).append(case.place)
-        return ', '.join(f'{text} {len(places)}' + ('' if text in kills.GOOD else f' ({", ".join(places)})') for text, places in counts.items())
+            counts.setdefault((case.text, case.good), []).append(case.place)
+        return ', '.join(f'{text} {len(places)}' + ('' if good else f' ({", ".join(places)})') for (text, good), places in counts.items())
 
     def kind(case):
         return kills.ORDERS[case.order_of, case.way], f'{case.point} {"a rename" if case.environment else "a file"}', case.server
