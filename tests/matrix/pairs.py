@@ -1,7 +1,8 @@
 """Two programs at once: in one workspace, and in two whose orders would bear one name on the server."""
+import select
 import shutil
+import socket
 import threading
-import time
 
 from cases import Case, Workspace
 from faults import Fault
@@ -70,9 +71,12 @@ class Pair(Case):
         """The first program is held at a command until the event it gives is set; its other event tells that it is there."""
         there, go_on = threading.Event(), threading.Event()
 
-        def act(*_):
+        def act(session, *_):
             there.set()
             go_on.wait(100)
+            line = session.client.socket if self.ftp else session.connection
+            if select.select([line], [], [], 0)[0] and not line.recv(1, socket.MSG_PEEK):
+                raise OSError    # the program has given up: the server must not begin now
 
         acts = self.relay.acts if self.way == 'ftp' else self.web.acts
         acts[word] = Act(act, times, first)
