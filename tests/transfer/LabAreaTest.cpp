@@ -118,7 +118,7 @@ TEST(LabArea, EachButtonIsSafeInEachPhase) {
     }
 }
 
-TEST(LabArea, AndNoStartDoesAnythingBeforeTheOrderIsListedOrUnderWay) {
+TEST(LabArea, NothingStartsBeforeTheOrderIsListedOrDuringASending) {
     for (const SendingPhase phase :
          {SendingPhase::Preparing, SendingPhase::Sending, SendingPhase::Checking, SendingPhase::Reporting}) {
         SCOPED_TRACE(static_cast<int>(phase));
@@ -137,6 +137,11 @@ TEST(LabArea, AndNoStartDoesAnythingBeforeTheOrderIsListedOrUnderWay) {
                   &FtpFrm::Command23_Click, &FtpFrm::cmdInternetOpen_Click, &FtpFrm::cmdClosehOpen_Click,
                   &FtpFrm::Command7_Click})
                 (page->*press)();
+            const FtpFrmControls& shown = page->controls();
+            EXPECT_FALSE(shown.chkPassive.enabled || shown.optBin.enabled || shown.optAscii.enabled);
+            page->chkPassive_Click(false);
+            page->optAscii_Click();
+            EXPECT_TRUE(shown.chkPassive.checked && shown.optBin.checked);
             if (phase != SendingPhase::Preparing)
                 page->Command28_Click();
         };

@@ -289,9 +289,9 @@ void FtpFrm::showProof() {
 }
 
 void FtpFrm::FtpEnableControls(bool enable) {
-    chkPassive.enabled = optBin.enabled = optAscii.enabled = enable;
     cmdClosehOpen.visible = enable;
     cmdInternetOpen.visible = txtProxy.visible = Label4Proxy.visible = !enable;
+    showLabButtons();
 }
 
 } // namespace lumora

@@ -166,6 +166,7 @@ void FtpFrm::showLabButtons() {
     Command2.enabled = Command4.enabled = mayAct() && !hasArrived(phase());
     for (Caption* manual : {&cmdInternetOpen, &cmdClosehOpen, &Command3, &Command5, &Command6, &Command7})
         manual->enabled = mayAct();
+    chkPassive.enabled = optBin.enabled = optAscii.enabled = mayAct() && cmdClosehOpen.visible;
     Q_EMIT changed();
 }
 

@@ -69,6 +69,8 @@ void FtpFrm::closeByHand() {
 }
 
 void FtpFrm::choosePassive(bool passive) {
+    if (!mayAct())
+        return;
     m_sender.session.passive = chkPassive.checked = passive;
     Q_EMIT changed();
 }
@@ -76,6 +78,8 @@ void FtpFrm::choosePassive(bool passive) {
 // Both buttons set the same transfer type: the lab's server takes all files, pictures too, as ASCII and keeps their
 // bytes.
 void FtpFrm::chooseType(bool binary) {
+    if (!mayAct())
+        return;
     m_sender.session.dwType = 1;
     optBin.checked = binary;
     optAscii.checked = !binary;
