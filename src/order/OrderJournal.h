@@ -39,7 +39,7 @@ public:
     Result<void> folderIsAsked();
     Result<void> folderIsRefused();
     // The customer sends the order again: without a state, it was sent by an older version. Writes nothing by itself.
-    void isSentAgain() { m_sentAgain = true; }
+    void markSentAgain() { m_sentAgain = true; }
     // A file's full path, before its put and after the put that was confirmed.
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);

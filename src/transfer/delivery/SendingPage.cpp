@@ -94,11 +94,9 @@ void SendingPage::tellPhase() {
 }
 
 void SendingPage::showReporting() {
-    m_shown.Label4Hokhaha.text = wording(u"ההגעה הוכחה לפי שמות בלבד: השרת אינו מוסר אורכים.",
-                                         u"Arrival is proven by names only: the server tells no lengths.");
-    m_shown.Label4Dooach.text = wording(u"הדיווח למעבדה התחיל, ולא ידוע אם התקבל.",
-                                        u"The report to the lab was begun, and it is not known whether it was heard.");
-    m_shown.Command4Dooach.text = wording(u"דווח שוב", u"Report again");
+    m_shown.Label4Hokhaha.text = wording(byNamesOnlyWords);
+    m_shown.Label4Dooach.text = wording(reportUnknownWords);
+    m_shown.Command4Dooach.text = wording(reportAgainWords);
     m_shown.Label4Hokhaha.visible = provenByNameOnly();
     m_shown.Label4Dooach.visible = reportUnknown();
     m_shown.Command4Dooach.enabled = mayReportAgain();
@@ -133,11 +131,13 @@ void SendingPage::forgetReason() {
 }
 
 void SendingPage::tellLab() {
-    ReportCalls* calls = reportCalls();
-    if (!calls)
-        return;
+    if (ReportCalls* calls = reportCalls())
+        tellWatched(&LabReport::tell, *calls);
+}
+
+void SendingPage::tellWatched(Telling telling, ReportCalls& calls) {
     Timer4Report.start();
-    report().tell(*calls);
+    (report().*telling)(calls);
     Timer4Report.stop();
 }
 
@@ -160,9 +160,7 @@ void SendingPage::reportAgain() {
     const SendingPhase before = m_phase;
     stopTimers();
     enter(SendingPhase::Reporting);
-    Timer4Report.start();
-    report().tellAgain(*calls);
-    Timer4Report.stop();
+    tellWatched(&LabReport::tellAgain, *calls);
     enter(before == SendingPhase::Countdown ? SendingPhase::Waiting : before);
 }
 

@@ -63,6 +63,7 @@ protected:
     virtual void stopTimers() = 0;
     // How the lab is told; no calls where it can't be.
     virtual LabReport& report() = 0;
+    virtual const LabReport& report() const = 0;
     virtual ReportCalls* reportCalls() = 0;
 
     void enter(SendingPhase phase);
@@ -96,7 +97,8 @@ private:
     void reportAgain();
     void watchReport();
     void showReporting();
-    const LabReport& report() const { return const_cast<SendingPage*>(this)->report(); }
+    using Telling = void (LabReport::*)(ReportCalls&);
+    void tellWatched(Telling telling, ReportCalls& calls);
 
     SendingControls& m_shown;
     Ticker Timer4Report; // 1000 ms: the watch over a telling

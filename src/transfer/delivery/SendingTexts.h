@@ -33,8 +33,13 @@ inline constexpr SendingWords numberTakenWords{
     u"המספר %1 כבר שייך בשרת להזמנה אחרת. ההזמנה תוכן מחדש במספר אחר.",
     u"Number %1 already belongs to another order on the server. Your order is prepared again under another number."};
 inline constexpr SendingWords notKeptWords{
-    u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה. יש לפנות מקום בדיסק או לתקן את ההרשאות. השליחה נמשכת.",
-    u"How far the sending has come can't be written on this computer. Free some space or mend the rights. The sending "
-    u"goes on."};
+    u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה. יש לפנות מקום בדיסק או לתקן את ההרשאות.",
+    u"How far the sending has come can't be written on this computer. Free some space or mend the rights."};
+inline constexpr SendingWords byNamesOnlyWords{u"ההגעה הוכחה לפי שמות בלבד: השרת אינו מוסר אורכים.",
+                                               u"Arrival is proven by names only: the server tells no lengths."};
+inline constexpr SendingWords reportUnknownWords{
+    u"הדיווח למעבדה התחיל, ולא ידוע אם התקבל.",
+    u"The report to the lab was begun, and it is not known whether it was heard."};
+inline constexpr SendingWords reportAgainWords{u"דווח שוב", u"Report again"};
 
 } // namespace lumora

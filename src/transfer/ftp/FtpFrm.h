@@ -94,6 +94,7 @@ private:
     void startCount();
     void stopTimers() override;
     LabReport& report() override { return m_sender.report; }
+    const LabReport& report() const override { return m_sender.report; }
     ReportCalls* reportCalls() override;
     void showSeconds();
     void showSecondsAfterFailure();
@@ -168,6 +169,7 @@ private:
 
     // FtpFrmLabArea.cpp
     bool mayAct() const;
+    bool mayList();
     void listNewOrder();
     void listResend();
     void refillAndSendInRounds();
@@ -177,6 +179,7 @@ private:
     void sendChainAfterFault();
     void SendChainOrder(const QString& name);
     void checkChosenOrder();
+    void listOnServer();
     void chooseOrder(int index);
     void showLabButtons();
 

@@ -16,21 +16,23 @@ bool FtpFrm::mayAct() const {
     return !busy() && phase() != SendingPhase::Preparing && !m_sender.stop.left;
 }
 
-void FtpFrm::listNewOrder() {
+// An order that has arrived is not listed again.
+bool FtpFrm::mayList() {
     if (!mayAct())
-        return;
-    if (hasArrived(phase()))
-        showHasArrived();
-    else
+        return false;
+    if (!hasArrived(phase()))
+        return true;
+    showHasArrived();
+    return false;
+}
+
+void FtpFrm::listNewOrder() {
+    if (mayList())
         beginNewOrder();
 }
 
 void FtpFrm::listResend() {
-    if (!mayAct())
-        return;
-    if (hasArrived(phase()))
-        showHasArrived();
-    else
+    if (mayList())
         beginResend();
 }
 
@@ -110,10 +112,7 @@ void FtpFrm::SendChainOrder(const QString& name) {
         if (mayBeSent()) {
             m_sender.beginOrder();
             m_state.transfer.ShemTikiya = name;
-            {
-                const StoppableLine line(m_platform);
-                m_sender.check.ListServerFiles();
-            }
+            listOnServer();
             m_sender.check.DropAlreadySent();
             end = lists().List3.isEmpty() ? m_sender.silentEnd() : m_sender.RunAttempts();
         }
@@ -146,11 +145,13 @@ void FtpFrm::checkChosenOrder() {
     m_state.transfer.ShemTikiya = lists().ListRezefFiles.currentItem();
     m_sender.stop.StopFlag = false;
     enter(SendingPhase::Checking);
-    {
-        const StoppableLine line(m_platform);
-        m_sender.check.ListServerFiles();
-    }
+    listOnServer();
     enter(before);
+}
+
+void FtpFrm::listOnServer() {
+    const StoppableLine line(m_platform);
+    m_sender.check.ListServerFiles();
 }
 
 void FtpFrm::chooseOrder(int index) {

@@ -31,7 +31,7 @@ private:
         }
         m_sender.check.begin();
         compare(attempt);
-        if (m_sender.check.endSilent())
+        if (m_sender.check.endEarly())
             return m_sender.unheardEnd();
         const Verdict verdict = m_sender.verdict();
         // After a stop the count is valid only if this check has read the server's folder itself.
@@ -95,7 +95,7 @@ private:
     std::optional<SendingPhase> checkArrival(int round) override {
         m_sender.check.begin();
         m_sender.check.ListServerFiles();
-        if (m_sender.check.endSilent())
+        if (m_sender.check.endEarly())
             return m_sender.unheardEnd();
         const Verdict verdict = m_sender.verdict();
         if (verdict == Verdict::All && (m_sender.check.freshCount || !m_stop.StopFlag))

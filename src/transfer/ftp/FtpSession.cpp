@@ -54,7 +54,7 @@ void FtpSession::beginOrder() {
     m_inFolder.clear();
     m_journal.emplace(m_platform.files, OrderFolder(m_transfer.OrderFolder));
     if (m_transfer.SugMishloah == Sending::Resend)
-        m_journal->isSentAgain();
+        m_journal->markSentAgain();
 }
 
 void FtpSession::beginPass() {

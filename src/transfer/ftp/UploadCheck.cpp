@@ -45,7 +45,7 @@ void UploadCheck::begin() {
     m_running = true;
 }
 
-bool UploadCheck::endSilent() {
+bool UploadCheck::endEarly() {
     m_running = false;
     if (!m_silent || m_stop.left)
         return false;
@@ -56,7 +56,7 @@ bool UploadCheck::endSilent() {
 }
 
 // By the way of a stop, which ends whatever is under way.
-void UploadCheck::beSilent() {
+void UploadCheck::endSilent() {
     m_silent = true;
     m_stop.StopFlag = true;
 }
@@ -67,7 +67,7 @@ void UploadCheck::watch() {
     m_silence.moved(m_platform.internet.bytesMoved(), m_platform.clock.now());
     if (!m_silence.over())
         return;
-    beSilent();
+    endSilent();
     m_platform.internet.abort();
 }
 
@@ -108,7 +108,7 @@ void UploadCheck::freshConnection() {
     m_session.walkToLabFolder();
     m_silence.connectsTimedOut(m_session.connectTimedOut);
     if (m_running && m_silence.over() && !m_stop.StopFlag)
-        beSilent();
+        endSilent();
 }
 
 bool UploadCheck::lookUp() {

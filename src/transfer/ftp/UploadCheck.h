@@ -26,7 +26,7 @@ public:
 
     // A check of an attempt begins and ends. True at the end where the server was silent for too long, which ended it.
     void begin();
-    bool endSilent();
+    bool endEarly();
     // Each second: ends a check whose line is silent.
     void watch();
 
@@ -69,7 +69,7 @@ private:
     bool nothingBroken() const { return m_lists.List4Broken.isEmpty() || m_lists.List6.isEmpty(); }
     void freshConnection();
 
-    void beSilent();
+    void endSilent();
 
     const TransferState& m_transfer;
     const Platform& m_platform;

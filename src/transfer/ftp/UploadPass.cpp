@@ -169,7 +169,7 @@ void UploadPass::send(const QString& path) {
     if (liesThere(path, name)) {
         if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
             m_skipped += *length;
-        isDone(path);
+        countDone(path);
         m_events.reached(SendingMoment::Skipped);
     } else {
         put(path, name);
@@ -177,7 +177,7 @@ void UploadPass::send(const QString& path) {
     m_events.reached(SendingMoment::FileDone, CurrentIndex + 1);
 }
 
-void UploadPass::isDone(const QString& path) {
+void UploadPass::countDone(const QString& path) {
     m_done += path;
     m_session.countFiles(static_cast<int>(m_done.size()));
 }
@@ -205,7 +205,7 @@ void UploadPass::put(const QString& path, const QString& name) {
     }
     if (IsBroken(broken, name))
         confirm(path);
-    isDone(path);
+    countDone(path);
     if (!m_session.lineEndsChanged(path))
         return;
     broken.append(path);

@@ -54,7 +54,7 @@ private:
     void send(const QString& path);
     bool liesThere(const QString& path, const QString& name);
     void confirm(const QString& path);
-    void isDone(const QString& path);
+    void countDone(const QString& path);
     void put(const QString& path, const QString& name);
     void closeWithPauses();
 

@@ -91,7 +91,7 @@ void HttpSender::BuildOrderFileList() {
     lists.List4Kvazim.append(HttpOrderFiles(m_platform.files, m_state.transfer.OrderFolder, ListFileName(0)));
     m_journal.emplace(m_platform.files, OrderFolder(m_state.transfer.OrderFolder));
     if (m_state.transfer.SugMishloah == Sending::Resend)
-        m_journal->isSentAgain();
+        m_journal->markSentAgain();
     report.beginOrder(&*m_journal);
     m_notKeptTold = false;
     m_owner = Owner::NotKnown;
@@ -134,7 +134,7 @@ void HttpSender::endSilent() {
     stop.StopFlag = true;
 }
 
-std::optional<SendingPhase> HttpSender::earlyEnd() {
+std::optional<SendingPhase> HttpSender::endEarly() {
     if (!stop.StopFlag || stop.left)
         return std::nullopt;
     stop.StopFlag = false;
@@ -165,7 +165,7 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
     if (m_owner == Owner::NotKnown && m_listFailure.kind == Failure::Kind::TimedOut && !stop.StopFlag)
         endSilent();
     if (m_owner != Owner::Ours || stopped())
-        return m_owner == Owner::Foreign ? SendingPhase::NumberTaken : earlyEnd();
+        return m_owner == Owner::Foreign ? SendingPhase::NumberTaken : endEarly();
     const QStringList files = lists.List4Hossarim.items();
     if (m_journal)
         keep(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
@@ -184,7 +184,7 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
         if (stopped())
             break;
     }
-    return earlyEnd();
+    return endEarly();
 }
 
 void HttpSender::post(const QString& path) {
@@ -222,7 +222,7 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
         m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
     }
     const bool all = posted && lists.List4Hossarim.isEmpty();
-    const std::optional<SendingPhase> early = all ? std::nullopt : earlyEnd();
+    const std::optional<SendingPhase> early = all ? std::nullopt : endEarly();
     // A failed post explains more than the list that lacks the file.
     if (m_allPosted && !all && !early && !stopped())
         m_events.failed(listTrouble(), m_listFailure);
@@ -256,7 +256,7 @@ std::optional<SendingPhase> HttpSender::findMissing() {
     m_endedEarly = false;
     const OnLine line(*this);
     compare(0);
-    return earlyEnd();
+    return endEarly();
 }
 
 void HttpSender::compare(int listNumber) {

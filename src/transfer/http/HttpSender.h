@@ -112,7 +112,7 @@ private:
     void compare(int listNumber);
     bool stopped() const { return m_stop.left || m_stop.StopFlag; }
     void endSilent();
-    std::optional<SendingPhase> earlyEnd();
+    std::optional<SendingPhase> endEarly();
     void keep(const Result<void>& written);
     void post(const QString& path);
     void downloadList(int listNumber);

@@ -217,11 +217,8 @@ void UploadForm::sendMissing() {
 }
 
 void UploadForm::endIncomplete(SendingPhase end) {
-    const bool afterTheLast = end == SendingPhase::NotAll && !m_sender.endedEarly();
-    m_attemptFailed = afterTheLast;
-    Label1.text = afterTheLast ? wording(u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
-                                         u"After three attempts the computer could not upload the whole order")
-                               : QString();
+    m_attemptFailed = end == SendingPhase::NotAll && !m_sender.endedEarly();
+    showAttemptsOver();
     Label9.visible = Pic4Hamten.visible = false;
     enter(end);
 }

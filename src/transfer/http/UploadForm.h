@@ -58,6 +58,7 @@ private:
     void countSecond();
     void stopTimers() override;
     LabReport& report() override { return m_sender.report; }
+    const LabReport& report() const override { return m_sender.report; }
     ReportCalls* reportCalls() override { return &m_sender; }
     void startPanel();
     void refreshList();
@@ -80,6 +81,7 @@ private:
     void showPhase(const PhaseLook& row) override;
     void showCount();
     void showTrouble();
+    void showAttemptsOver();
     void showLeft();
     void showOrder();
     void showAnswers();

@@ -20,6 +20,8 @@ constexpr SendingWords stoppedTitle{u"המשלוח נעצר", u"The sending is s
 constexpr SendingWords fewerArrived{
     u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",
     u"%1 of the %2 pictures in the order's log have arrived, and the lab was not told. Please call the lab."};
+constexpr SendingWords threeAttempts{u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
+                                     u"After three attempts the computer could not upload the whole order"};
 constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "};
 
 } // namespace
@@ -129,6 +131,10 @@ void UploadForm::showTrouble() {
     const bool told = m_attemptFailed || !reason().isEmpty();
     Pic4Trouble.visible = told && isUnderWay(phase());
     Pic4Failure.visible = told && look().sign == SendingSign::Bad;
+}
+
+void UploadForm::showAttemptsOver() {
+    Label1.text = m_attemptFailed ? wording(threeAttempts) : QString();
 }
 
 void UploadForm::showLeft() {
