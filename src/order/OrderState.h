@@ -32,8 +32,9 @@ struct OrderState {
     QString serial; // Shemot.ser
     OrderKind kind = OrderKind::NotChosen;
     Way way = Way::Ftp;
-    bool makesFolder = false;      // the server was about to be asked for the folder, and the answer is not known
-    bool folderMadeByUs = false;   // this order made its folder on the server
+    bool makesFolder = false; // the server was about to be asked for the folder, and the answer is not known
+    // The folder on the server is known as this order's own: made by it, or recognised (docs/guards.md).
+    bool folderMadeByUs = false;
     bool fewerAgreed = false;      // all files of its folder arrived; the customer agreed that the log names more
     bool sentBefore = false;       // first known by a resend; an older version has sent it
     bool provenByNameOnly = false; // the server told no lengths

@@ -25,7 +25,7 @@ public:
     enum class Accept { Nothing, Save, GiveUp };
     Accept accept(const RedEyePicture& picture) const;
 
-    // The editor loads the picture by its record behind an accept and in full colour.
+    // The editor loads the picture by its record after an accept and in full colour.
     bool isSeen() const;
 
 private:

@@ -25,7 +25,7 @@ public:
 
     // answer: of the server about the order's folder. uploads: the folder's address, with its last slash.
     Owner of(const OrderJournal& order, const ServerAnswer& answer, const QString& uploads) const;
-    // What a first post may claim: the folder is known as the order's own.
+    // True where a first post makes the folder known as the order's own; as built in never.
     bool claims() const;
 
 private:

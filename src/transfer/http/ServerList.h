@@ -34,7 +34,7 @@ struct ServerAnswer {
     QStringList entries;                                // empty when the folder is unknown to the server
     bool namesFolder = false;                           // with or without a total, whose number is not compared
     // Names in the folder but for the server's own lists; empty where there is no folder. No value: the answer does
-    // not tell. A text that is too short to be a listing tells of an empty folder.
+    // not tell. A listing that is too short to have entries can still tell of an empty folder.
     std::optional<QStringList> files;
 };
 bool TellsUnknownFolder(const QString& answer);

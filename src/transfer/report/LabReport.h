@@ -36,7 +36,7 @@ public:
 
     // The sending ends so, and so much has arrived.
     void keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly);
-    // For an order that lay whole on the server before anything was sent, behind keepArrival(): true where the lab has
+    // For an order that lay whole on the server before anything was sent, after keepArrival(): true where the lab has
     // yet to be told of it.
     bool isDueWhereFound() const;
     // The order has arrived, and only the lab was not told of it yet.

@@ -26,7 +26,7 @@ private:
     void makeBars();
     QWidget* blinkingSigns();
 
-    // FtpLabAreaView.cpp
+    // FtpFrmViewLabArea.cpp
     void makeLabArea();
     QLayout* makeSendingLists();
     QLayout* makeChain();

@@ -57,7 +57,7 @@ void SendingView::addLabList(QGridLayout& to, const Caption& heading, const char
     QListWidget* made = picked ? list(rows, std::move(picked), shown) : listing(rows, shown);
     setRole(made, "lab");
     made->setLayoutDirection(Qt::LeftToRight);
-    made->setMinimumHeight(theme().px(110));
+    made->setMinimumHeight(theme().px(LabBoxHeight));
     bindList(QString::fromUtf16(name), rows, made, shown);
     QLabel* title = label(heading, "smallMuted");
     title->setBuddy(made);

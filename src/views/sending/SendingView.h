@@ -33,6 +33,8 @@ protected:
                     std::function<void(int)> picked = {});
     // The lab's own area: a panel over the page, which scrolls where it is higher than the window.
     Overlay* makeLabPanel(std::initializer_list<Item> parts, QPushButton* close);
+    // The least height of a list or an answer there, before the theme's factor.
+    static constexpr int LabBoxHeight = 110;
     // What the lab's own area tells of arrival and report.
     QLayout* makeReporting();
     // The lists of the rules, for scenarios and tests.

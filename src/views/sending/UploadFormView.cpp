@@ -74,7 +74,7 @@ QPlainTextEdit* UploadFormView::answer(const Caption& caption) {
     made->setReadOnly(true);
     made->setFocusPolicy(Qt::NoFocus);
     made->setLayoutDirection(Qt::LeftToRight);
-    made->setMinimumHeight(theme().px(110));
+    made->setMinimumHeight(theme().px(LabBoxHeight));
     bindName(made, caption);
     return made;
 }
