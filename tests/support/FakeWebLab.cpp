@@ -40,8 +40,6 @@ Result<QByteArray> FakeWebLab::fetch(const QString& url) {
         return *file;
     if (!url.contains(u"listfileb.php"_s)) {
         reports += url;
-        if (strikes(deadReports))
-            return down();
         return QByteArray("OK");
     }
     const QString folder = url.mid(url.indexOf(u"tik="_s) + 4);

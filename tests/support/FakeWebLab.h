@@ -17,11 +17,10 @@ public:
 
     int deadPosts = 0;                     // posts that reach nobody; always is for good
     int deadCalls = 0;                     // the same of fetches and downloads
-    int deadReports = 0;                   // the same of calls that are no list
     std::map<QString, int> losses;         // how often a file is accepted and not stored
-    std::map<QString, int> halves;         // how often half of a file is stored behind a good answer
+    std::map<QString, int> halves;         // how often half of a file is stored after a good answer
     std::map<QString, int> cuts;           // how often the line is cut in the middle of a file, which is stored
-    std::map<QString, int> lostAnswers;    // how often the line is cut behind the last byte of a file
+    std::map<QString, int> lostAnswers;    // how often the line is cut after the last byte of a file
     bool tellsNoLength = false;            // to HEAD
     std::optional<QByteArray> listInstead; // what each list file says
     bool refusesLists = false;             // no list file is given out

@@ -368,6 +368,21 @@ TEST_F(UploadFormTest, AnOrderThatArrivedBeforeIsOnlyReported) {
     EXPECT_EQ(lab.urls.size(), 2) << "no list";
 }
 
+TEST_F(UploadFormTest, NothingIsWrittenOutsideTheOrderAndTheKeptList) {
+    const auto outside = [&] {
+        QStringList all;
+        for (const QString& folder : {u"C:\\"_s, u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s})
+            all += rig.test.files.names(DrivePath(folder), u"*.*"_s);
+        return all;
+    };
+    const QStringList before = outside();
+    lab.listInstead = UploadFormRig::name().toLatin1() +
+                      "~~..\\..\\evil.txt~~/tmp/evil.txt~~C:\\2000lumora\\evil.txt~~021015GNB0000_03AABB.jpp~~total:4";
+    rig.send();
+    EXPECT_EQ(outside(), before + QStringList(u"filelist1.txt"_s));
+    EXPECT_EQ(rig.localFiles().size(), 5u);
+}
+
 TEST_F(UploadFormTest, AFileThatNeverCameToTheLineIsNotLaidToTheServer) {
     const QString quoted = u"311015GNB0003_03\".jpp"_s; // its header would end at the quote
     rig.write(quoted, "x");
