@@ -345,7 +345,7 @@ def other_length(session):
     return session.answer(b'', length=path.stat().st_size + 7) or True if path.is_file() else False
 
 
-# The first list is asked for before anything is sent. Without a list that can be read the next attempt posts all again.
+# The first list is asked for before anything is sent. Without any list that can be read the next attempt posts all again.
 FIRST = 2
 HTTP = [
     Fault('no fault', quick=True),
@@ -371,26 +371,26 @@ HTTP = [
     Fault('POST: stored, line cut, once', {'POST': (stores_and_drops, 1, 2)}),
     Fault('POST: redirect 302', {'POST': redirects(302)}),
     Fault('POST: redirect 307', {'POST': redirects(307)}),
-    Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}, again=5),
+    Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}),
     Fault('list script: 500, always', {'MAKELIST': (says(b'', 500), ALWAYS, FIRST)}, again=10),
-    Fault('list script: silence, once', {'MAKELIST': (silent, 1, FIRST)}, clock=20, limit=120, again=5),
+    Fault('list script: silence, once', {'MAKELIST': (silent, 1, FIRST)}, clock=20, limit=120),
     Fault('list script: redirect', {'MAKELIST': redirects(302)}),
     Fault('list with ".", a file not stored',
           {'MAKELIST': lists(lambda entries: [*entries[:-1], '.', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 5)}),
     Fault('list with parts of names, files not stored',
           {'MAKELIST': lists(lambda entries: [*entries[:-1], 'jpp', 'jpp', 'txt', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 3)}),
     Fault('list with names in capitals', {'MAKELIST': lists(lambda entries: [*entries[:1], *map(str.upper, entries[1:-1]), entries[-1]])}),
-    Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}, again=5),
-    Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}, again=5),
+    Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}),
+    Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}),
     Fault('list lacks a file, once', {'MAKELIST': (lists(lambda entries: [*entries[:2], *entries[3:]]), 1, FIRST)}, again=1),
     Fault('list: redirect', {'FETCH': lambda session: session.answer(b'', 302, Location=session.path + '?again') or True
                              if '?' not in session.path else False}),
-    Fault('list: 404, once', {'FETCH': (says(b'no such file', 404), 1, 4)}, again=5),
+    Fault('list: 404, once', {'FETCH': (says(b'no such file', 404), 1, 4)}),
     Fault('list: 404, always', {'FETCH': says(b'no such file', 404)}, again=10),
-    Fault('list: a page of words, 200', {'FETCH': (says(b'<html>This site is being worked on. Please come back.</html>'), 2, 3)}, again=5),
-    Fault('list without end', {'FETCH': (without_end, 2, 3)}, limit=120, again=5),
-    Fault('list: Content-Length too large', {'FETCH': (of_list(add=100), 2, 3)}, quick=True, again=5),
-    Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}, again=5),
+    Fault('list: a page of words, 200', {'FETCH': (says(b'<html>This site is being worked on. Please come back.</html>'), 2, 3)}),
+    Fault('list without end', {'FETCH': (without_end, 2, 3)}, limit=120),
+    Fault('list: Content-Length too large', {'FETCH': (of_list(add=100), 2, 3)}, quick=True),
+    Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}),
     Fault('no HEAD', {'HEAD': says(b'', 405)}),
     Fault('HEAD: 404', {'HEAD': says(b'', 404)}),
     Fault('HEAD: line cut, once', {'HEAD': (drops, 1, 2)}, again=1),

@@ -86,6 +86,13 @@ TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
     }
 }
 
+TEST_F(UploadFormTest, CarefullyNothingIsPostedAgainForAListThatCouldNotBeReadOnce) {
+    rig.state.Careful = true;
+    lab.onPost = [&](const QString&) { lab.deadCalls = lab.posted.size() == 5 ? 3 : 0; };
+    EXPECT_EQ(rig.send().phase(), SendingPhase::Success);
+    EXPECT_EQ(lab.posted.size(), 5);
+}
+
 TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBrokenFiles) {
     for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
         for (const bool careful : {true, false}) {

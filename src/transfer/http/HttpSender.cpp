@@ -219,6 +219,8 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
     if (posted) {
         m_silence.begin();
         compare(m_listNumber);
+        if (m_listGuard.asksAgain(m_verdict) && !stopped())
+            compare(HttpListGuard::first);
         m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
     }
     const bool all = posted && lists.List4Hossarim.isEmpty();
