@@ -1,6 +1,6 @@
 // Loaded in front of a program by LD_PRELOAD. Its monotonic clock, its waits and the limits of its sockets run
 // MATRIX_CLOCK times as fast; at rename MATRIX_KILL the program is killed, before it or, if the number is negative,
-// behind it. The targets of all renames are written to the file MATRIX_RENAMES, a line each.
+// after it. The targets of all renames are written to the file MATRIX_RENAMES, a line each.
 #include <dlfcn.h>
 #include <poll.h>
 #include <sys/epoll.h>

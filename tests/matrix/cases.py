@@ -290,7 +290,7 @@ class Case:
         return self
 
     def survived(self):
-        """Without a fault, and with Careful behind one that comes once, the order arrives at the first sending."""
+        """Without a fault, and with Careful after one that comes once, the order arrives at the first sending."""
         return self.fault.name == 'no fault' or (self.careful and self.fault.name.endswith(', once'))
 
     def play_case(self):

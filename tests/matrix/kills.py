@@ -6,7 +6,7 @@ NOT_KNOWN = 'arrived whole, whether the lab was told is not known'
 GOOD = ('arrived whole', 'nothing was begun', NOT_KNOWN)
 ORDERS = {('plain', 'ftp'): 'plain order by FTP', ('edited', 'ftp'): 'edited order by FTP', ('edited', 'http'): 'edited order by HTTP'}
 FILES = {'ftp': 6, 'http': 5}   # of an order: log, sheet, three prints, by FTP the small picture
-POINTS = ('before', 'in', 'behind')
+POINTS = ('before', 'in', 'after')
 QUICK = 3   # the file at which ./test kills
 
 
@@ -45,7 +45,7 @@ def of_order(order, way, careful, plan):
     """The kills of an order. plan: what its renames make. While a customer still edits no order is begun: that is played once."""
     begins = plan.index('the state') if order == 'edited' and (way, careful) != ('ftp', True) else 0
     for at, made in enumerate(plan, 1):
-        for point in ('before', 'behind') if at > begins else ():
+        for point in ('before', 'after') if at > begins else ():
             yield order, way, 'scripted', point, at, made, careful
     for at in range(1, FILES[way] + 1):
         for point in POINTS:
@@ -60,7 +60,7 @@ def is_quick(order, way, server, point, at, made, careful):
 def before(servers, guards):
     """Real servers hold what a dead program has left: open files, locks, sessions."""
     for server in servers:
-        for point in ('in', 'behind', 'power cut in'):
+        for point in ('in', 'after', 'power cut in'):
             for careful in guards:
                 yield 'plain', 'ftp', server, point, QUICK, '', careful
 
@@ -87,7 +87,7 @@ class Kill(Case):
         # Not all that the dead program's socket still holds comes through.
         return session.forward(line, change=lambda content: self.mine.kill() or content[:len(content) // 2])
 
-    def ftp_behind(self, session, line):
+    def ftp_after(self, session, line):
         session.forward(line)
         self.mine.kill()
         return True
@@ -104,7 +104,7 @@ class Kill(Case):
         session.store(lambda content: content[:len(content) // 2])
         self.http_before(session)
 
-    def http_behind(self, session):
+    def http_after(self, session):
         session.good('POST')
         self.mine.kill()
         return True

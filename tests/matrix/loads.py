@@ -8,7 +8,7 @@ from faults import Fault
 from relay import Act
 
 MEMORY = 100        # MB that the sending of 1,000 pictures may hold at most
-# How many seconds longer than vsftpd proftpd may take for a file: it takes no connection for 0.2 s, twice, behind each session that ends.
+# How many seconds longer than vsftpd proftpd may take for a file. After each session that ends it takes no connection for 0.2 s, twice.
 SLOWER = 0.5
 TIMED = 100         # files, log, sheet and small picture among them
 ROUNDS = 3

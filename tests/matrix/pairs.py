@@ -154,7 +154,7 @@ def one_workspace_at_once(case):
 
 
 def one_serial(case):
-    """Two data folders with one mark, one order behind the other."""
+    """Two data folders with one mark, one order after the other."""
     first = case.send(case.mine)
     case.make_other(mark=True)
     case.judge(first, case.send(case.other))
