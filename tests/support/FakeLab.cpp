@@ -180,11 +180,11 @@ Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const
     return std::unique_ptr<FtpConnection>(std::make_unique<FakeConnection>(*this));
 }
 
-Result<QByteArray> FakeLab::fetch(const QString& url) {
+Result<WebAnswer> FakeLab::fetch(const QString& url) {
     urls += url;
     if (onFetch)
         onFetch();
-    return QByteArray("ok");
+    return WebAnswer{"ok"};
 }
 
 } // namespace lumora

@@ -67,7 +67,7 @@ public:
     bool connectedState() const override { return deadOpens == 0; }
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
-    Result<QByteArray> fetch(const QString& url) override;
+    Result<WebAnswer> fetch(const QString& url) override;
     void abort() override { ++aborts; }
 
     DataChannel lastChannel = DataChannel::Passive;

@@ -32,21 +32,25 @@ QByteArray FakeWebLab::listOf(const QString& folder) const {
     return AnsiCodePage::encode(entries.join(u"~~"_s));
 }
 
-Result<QByteArray> FakeWebLab::fetch(const QString& url) {
+Result<WebAnswer> FakeWebLab::fetch(const QString& url) {
     urls += url;
     if (strikes(deadCalls))
         return down();
+    for (const auto& [part, page] : pages) {
+        if (url.contains(part))
+            return page;
+    }
     if (const QByteArray* file = fileAt(url))
-        return *file;
+        return WebAnswer{*file};
     if (!url.contains(u"listfileb.php"_s)) {
         reports += url;
-        return QByteArray("OK");
+        return WebAnswer{"OK"};
     }
     const QString folder = url.mid(url.indexOf(u"tik="_s) + 4);
     if (!uploads.contains(folder))
-        return QByteArray("folder not found");
+        return WebAnswer{"folder not found"};
     m_listed.insert(folder);
-    return QByteArray("ok");
+    return WebAnswer{"ok"};
 }
 
 const QByteArray* FakeWebLab::fileAt(const QString& url) const {
@@ -57,7 +61,7 @@ const QByteArray* FakeWebLab::fileAt(const QString& url) const {
     return file == folder->second.end() ? nullptr : &file->second;
 }
 
-Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& request) {
+Result<WebAnswer> FakeWebLab::post(const QString& url, const PostRequest& request) {
     urls += url;
     posts.push_back(request);
     const QString head = AnsiCodePage::decode(request.body.left(400));
@@ -68,6 +72,8 @@ Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& reque
         onPost(name);
     if (strikes(deadPosts))
         return Failure{deadConnectKind, u"nobody answers"_s};
+    if (strikes(refusals[name]))
+        return WebAnswer{"no room", 500};
     const QString folder = between(url, u"folder="_s, u"&"_s);
     const qsizetype from = request.body.indexOf("\r\n\r\n") + 4;
     const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
@@ -77,7 +83,7 @@ Result<QByteArray> FakeWebLab::post(const QString& url, const PostRequest& reque
         uploads[folder][name] = request.body.mid(from, isCut || strikes(halves[name]) ? (end - from) / 2 : end - from);
     if (isCut || strikes(lostAnswers[name]))
         return down();
-    return QByteArray("stored");
+    return WebAnswer{"stored"};
 }
 
 Result<std::optional<qint64>> FakeWebLab::contentLength(const QString& url) {

@@ -23,11 +23,13 @@ public:
     std::map<QString, int> lostAnswers;    // how often the line is cut after the last byte of a file
     bool tellsNoLength = false;            // to HEAD
     std::optional<QByteArray> listInstead; // what each list file says
+    std::map<QString, int> refusals;       // how often a file is answered with 500 and not stored
+    std::map<QString, WebAnswer> pages;    // what an address that holds the key is answered with instead
     bool refusesLists = false;             // no list file is given out
     std::function<void(const QString& name)> onPost;
 
-    Result<QByteArray> fetch(const QString& url) override;
-    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<WebAnswer> fetch(const QString& url) override;
+    Result<WebAnswer> post(const QString& url, const PostRequest& request) override;
     Result<std::optional<qint64>> contentLength(const QString& url) override;
     Result<void> download(const QString& url, const HostPath& target) override;
 

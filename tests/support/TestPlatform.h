@@ -98,8 +98,8 @@ public:
                                                       DataChannel) override {
         return noLine();
     }
-    Result<QByteArray> fetch(const QString&) override { return noLine(); }
-    Result<QByteArray> post(const QString&, const PostRequest&) override { return noLine(); }
+    Result<WebAnswer> fetch(const QString&) override { return noLine(); }
+    Result<WebAnswer> post(const QString&, const PostRequest&) override { return noLine(); }
     Result<std::optional<qint64>> contentLength(const QString&) override { return noLine(); }
     Result<void> download(const QString&, const HostPath&) override { return noLine(); }
 

@@ -95,10 +95,11 @@ TEST_F(UploadFormTest, CarefullyNothingIsPostedAgainForAListThatCouldNotBeReadOn
 
 TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBrokenFiles) {
     for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
-        for (const bool careful : {true, false}) {
+        for (const auto& [careful, refused] : {std::pair(true, 0), std::pair(false, 0), std::pair(false, 1)}) {
             FakeWebLab other;
             UploadFormRig dead(other);
             dead.state.Careful = careful;
+            other.refusals[UploadFormRig::first()] = refused;
             dead.state.transfer.SugMishloah = sending;
             dead.write(u"Kashloo.txt"_s, "C:\\a.jpp\r\n");
             const OrderFolder order(UploadFormRig::folder());
@@ -111,7 +112,7 @@ TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndNoListOfBroke
             OrderState meanwhile;
             other.onPost = [&](const QString&) { meanwhile = ReadOrderState(dead.test.files, order).value(); };
             EXPECT_EQ(dead.send().phase(), SendingPhase::Success);
-            EXPECT_EQ(other.posted, QStringList(UploadFormRig::first()));
+            EXPECT_EQ(other.posted, QStringList(1 + refused, UploadFormRig::first()));
             EXPECT_EQ(meanwhile.filesInHand, QStringList(path));
             EXPECT_EQ(meanwhile.phase, OrderState::Phase::Sending);
             EXPECT_EQ(other.uploads[UploadFormRig::name()], sent);
@@ -208,8 +209,10 @@ TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
     const QString name = UploadFormRig::name();
     for (const Case& each : cases) {
         for (const bool careful : {true, false}) {
-            for (const int free : {107, 0}) { // 0: the basket is gone
-                SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : "") + std::to_string(free));
+            // 0: the basket is gone. Late: the folder is made while the customer holds the sending.
+            for (const auto& [free, late] : {std::pair(107, false), std::pair(0, false), std::pair(0, true)}) {
+                SCOPED_TRACE(std::string(each.what) + (careful ? ", careful" : "") + std::to_string(free) +
+                             (late ? ", late" : ""));
                 FakeWebLab other;
                 UploadFormRig order(other);
                 order.state.Careful = careful;
@@ -225,13 +228,21 @@ TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
                 if (each.postedInto) {
                     ASSERT_TRUE(journal.sendingBegins(Sender::Http, true));
                 }
-                if (each.there)
-                    other.uploads[name] = *each.there;
                 other.uploads[u"2026_11_21_KUP_1234^106"_s] = {};
-                const FakeLab::Folder before = other.uploads[name];
-                if (!each.there)
-                    other.uploads.erase(name);
-                UploadForm& page = order.send();
+                const FakeLab::Folder before = each.there.value_or(FakeLab::Folder());
+                if (late) {
+                    order.start();
+                    order.page().Command3_Click();
+                }
+                if (each.there)
+                    other.uploads[name] = before;
+                if (late) {
+                    order.page().Command10_Click();
+                    order.countDown();
+                } else {
+                    order.send();
+                }
+                UploadForm& page = order.page();
                 if (each.ours || !careful) {
                     EXPECT_EQ(page.phase(), SendingPhase::Success);
                     EXPECT_EQ(ReadOrderState(order.test.files, OrderFolder(UploadFormRig::folder()))->folderMadeByUs,
@@ -255,6 +266,57 @@ TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
     }
 }
 
+TEST_F(UploadFormTest, AnErrorPageDoesNotTellWhoseAFolderIs) {
+    const QString script = u"listfileb.php"_s;
+    const struct {
+        const char* what;
+        QString address;
+        WebAnswer page;
+        std::optional<bool> folder; // what the same page tells of another name
+        SendingPhase end = SendingPhase::NotAll;
+    } cases[] = {
+        {"the script's own answer", script, {"folder not found"}, false, SendingPhase::Success},
+        {"no script", script, {"404 Not Found", 404}, std::nullopt},
+        {"busy", script, {"not now", 503}, std::nullopt},
+        {"a short page", script, {"<html>You are not logged in"}, true},
+        {"a long text", script, {"You are not logged in. Please log in to go on."}, true},
+        {"a list with the word", script, {"a~~notes.jpp~~total:2"}, true},
+        {"a log that is not given out", UploadFormRig::log(), {"no order", 500}, false},
+    };
+    for (const auto& each : cases) {
+        SCOPED_TRACE(each.what);
+        FakeWebLab other;
+        UploadFormRig order(other);
+        order.state.Careful = true;
+        other.pages[each.address] = each.page;
+        const FakeLab::Folder there{{UploadFormRig::log(), "no order"}};
+        const bool free = each.end == SendingPhase::Success;
+        if (!free)
+            other.uploads[UploadFormRig::name()] = there;
+        RecordedSending told;
+        EXPECT_EQ(HttpSender(order.state, order.test.platform, told).hasFolder(u"2026_11_21_KUP_1234^106"_s),
+                  each.folder);
+        if (free)
+            other.pages.clear();
+        EXPECT_EQ(order.send().phase(), each.end);
+        EXPECT_EQ(other.posted.isEmpty(), !free);
+        EXPECT_TRUE(free || other.uploads[UploadFormRig::name()] == there);
+    }
+}
+
+TEST_F(UploadFormTest, TheLabsCheckByNamesLeavesWhatIsToBeSent) {
+    rig.state.Careful = true;
+    lab.uploads[UploadFormRig::name()] = rig.localFiles();
+    lab.uploads[UploadFormRig::name()][UploadFormRig::first()].chop(5);
+    rig.start().Command7_Click();
+    EXPECT_EQ(rig.page().controls().TxtWeb.text, u"1"_s);
+    EXPECT_EQ(rig.page().controls().Label12.text, u"1"_s);
+    rig.page().Command10_Click();
+    rig.countDown();
+    EXPECT_TRUE(hasArrived(rig.page().phase()));
+    EXPECT_EQ(lab.uploads[UploadFormRig::name()], rig.localFiles());
+}
+
 TEST_F(UploadFormTest, AStopTakesEffectAtOnceAndTheSendingGoesOnFromThere) {
     for (const auto phase : {SendingPhase::Preparing, SendingPhase::Sending, SendingPhase::Checking}) {
         for (const bool inPost : {false, true}) {
@@ -262,6 +324,9 @@ TEST_F(UploadFormTest, AStopTakesEffectAtOnceAndTheSendingGoesOnFromThere) {
                 continue;
             FakeWebLab other;
             UploadFormRig stopped(other);
+            OrderJournal journal(stopped.test.files, OrderFolder(UploadFormRig::folder()));
+            ASSERT_TRUE(journal.begin(stopped.state, OrderState::Way::Http, {u"a line of the basket"_s}));
+            ASSERT_TRUE(journal.prepared());
             int pressedAt = 0;
             const auto press = [&] {
                 if (pressedAt > 0 || !stopped.chain.find(PageId::UploadForm) || stopped.page().phase() != phase)
@@ -276,6 +341,8 @@ TEST_F(UploadFormTest, AStopTakesEffectAtOnceAndTheSendingGoesOnFromThere) {
             stopped.send();
             EXPECT_EQ(stopped.page().phase(), SendingPhase::Stopped);
             EXPECT_EQ(other.aborts, 1);
+            EXPECT_EQ(ReadOrderState(stopped.test.files, OrderFolder(UploadFormRig::folder()))->items.isEmpty(),
+                      !other.posted.isEmpty());
             EXPECT_LT(stopped.test.pump.count - pressedAt, 20);
             EXPECT_EQ(other.reports, QStringList());
             stopped.page().Command10_Click();

@@ -78,6 +78,13 @@ struct PostRequest {
     QString password;
 };
 
+// A web server's answer. Outside 200 to 299 the body is a page about the fault and not what was asked for.
+struct WebAnswer {
+    QByteArray body;
+    int status = 200;
+    bool good() const { return status >= 200 && status <= 299; }
+};
+
 class Internet {
 public:
     virtual ~Internet() = default;
@@ -100,13 +107,13 @@ public:
     virtual qint64 bytesMoved() const { return 0; }
 
     // GET, past every cache. A redirect to the same host is followed, at most five in a row. The URL goes out as it
-    // stands, in the ANSI code page, only a blank as %20; CR, LF and NUL count as blanks and "#" does not cut. The
-    // answer's body whatever the status is.
-    virtual Result<QByteArray> fetch(const QString& url) = 0;
+    // stands, in the ANSI code page, only a blank as %20; CR, LF and NUL count as blanks and "#" does not cut. An
+    // answer of any status is a success.
+    virtual Result<WebAnswer> fetch(const QString& url) = 0;
 
-    // POST to an address that goes out as that of fetch does. The answer's body whatever the status is, but for a
-    // redirect: 307 and 308 to the same host repeat the POST, any other is a failure.
-    virtual Result<QByteArray> post(const QString& url, const PostRequest& request) = 0;
+    // POST to an address that goes out as that of fetch does. An answer of any status is a success, but for a redirect:
+    // 307 and 308 to the same host repeat the POST, any other is a failure.
+    virtual Result<WebAnswer> post(const QString& url, const PostRequest& request) = 0;
 
     // The length in bytes that the server tells of an address, asked by HEAD; no value where it does not answer 200 to
     // 299 or tells none.

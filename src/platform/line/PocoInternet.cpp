@@ -120,11 +120,11 @@ Result<std::unique_ptr<FtpConnection>> PocoInternet::connectFtp(const QString& h
 
 namespace {
 
-// The body of an answer, kept whole.
+// An answer with its body, kept whole.
 template <class Call>
-Result<QByteArray> bodyOf(EventPump* pump, Call call) {
+Result<WebAnswer> answerOf(EventPump* pump, Call call) {
     return RunBlocking(
-        [&]() -> Result<QByteArray> {
+        [&]() -> Result<WebAnswer> {
             QByteArray body;
             const auto answer = call([&](const char* bytes, std::size_t count) {
                 body.append(bytes, static_cast<qsizetype>(count));
@@ -132,21 +132,21 @@ Result<QByteArray> bodyOf(EventPump* pump, Call call) {
             });
             if (!answer)
                 return answer.failure();
-            return body;
+            return WebAnswer{body, answer->status};
         },
         pump);
 }
 
 } // namespace
 
-Result<QByteArray> PocoInternet::fetch(const QString& url) {
+Result<WebAnswer> PocoInternet::fetch(const QString& url) {
     const LineCall line(m_limits, m_line->abort);
-    return bodyOf(m_line->pump, [&](const BodySink& sink) { return HttpGet(url, line, sink); });
+    return answerOf(m_line->pump, [&](const BodySink& sink) { return HttpGet(url, line, sink); });
 }
 
-Result<QByteArray> PocoInternet::post(const QString& url, const PostRequest& request) {
+Result<WebAnswer> PocoInternet::post(const QString& url, const PostRequest& request) {
     const LineCall line(m_limits, m_line->abort);
-    return bodyOf(m_line->pump, [&](const BodySink& sink) { return HttpPost(url, request, line, sink); });
+    return answerOf(m_line->pump, [&](const BodySink& sink) { return HttpPost(url, request, line, sink); });
 }
 
 Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {

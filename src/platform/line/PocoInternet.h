@@ -19,8 +19,8 @@ public:
     void abort() override;
     void pumpWhileWaiting(EventPump* pump) override;
     qint64 bytesMoved() const override;
-    Result<QByteArray> fetch(const QString& url) override;
-    Result<QByteArray> post(const QString& url, const PostRequest& request) override;
+    Result<WebAnswer> fetch(const QString& url) override;
+    Result<WebAnswer> post(const QString& url, const PostRequest& request) override;
     Result<std::optional<qint64>> contentLength(const QString& url) override;
     Result<void> download(const QString& url, const HostPath& target) override;
 

@@ -29,11 +29,10 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
     const Result<QByteArray> ours = m_platform.files.read(order.folder().logPath());
     if (found == answer.files->end() || !ours)
         return Owner::Foreign;
-    // A page that says why the log is not given out differs from it too.
-    const Result<QByteArray> theirs = m_platform.internet.fetch(uploads + NameInAddress(*found));
-    if (!theirs)
+    const Result<WebAnswer> theirs = m_platform.internet.fetch(uploads + NameInAddress(*found));
+    if (!theirs || !theirs->good())
         return Owner::NotKnown;
-    return *theirs == *ours ? Owner::Ours : Owner::Foreign;
+    return theirs->body == *ours ? Owner::Ours : Owner::Foreign;
 }
 
 } // namespace lumora

@@ -16,7 +16,7 @@ public:
     enum class Owner {
         Ours,     // posted into by this order, or not there, or without a file, or with this order's log in it
         Foreign,  // the log there differs by a byte at least, or there is none
-        NotKnown, // the list could not be read, or the line was cut
+        NotKnown, // the list could not be read, the log was not given out, or the line was cut
     };
 
     HttpFolderOwner(const SessionState& state, const Platform& platform)

@@ -82,8 +82,8 @@ void HttpSender::HttpPause(int times) {
 }
 
 QString HttpSender::FetchUrl(const QString& url) const {
-    const auto body = m_platform.internet.fetch(url);
-    return body ? AnsiCodePage::decode(*body) : QString();
+    const auto answer = m_platform.internet.fetch(url);
+    return answer ? AnsiCodePage::decode(answer->body) : QString();
 }
 
 void HttpSender::BuildOrderFileList() {
@@ -159,7 +159,8 @@ std::optional<SendingPhase> HttpSender::HttpAttempts() {
 
 std::optional<SendingPhase> HttpSender::sendMissing(int) {
     m_allPosted = true;
-    if (m_owner == Owner::NotKnown)
+    // The answer may be hours old: the customer may have held the sending.
+    if (m_owner == Owner::NotKnown || !isEntered())
         compare(m_listNumber);
     // Another attempt could not post either, and would wait as long.
     if (m_owner == Owner::NotKnown && m_listFailure.kind == Failure::Kind::TimedOut && !stop.StopFlag)
@@ -167,8 +168,6 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
     if (m_owner != Owner::Ours || stopped())
         return m_owner == Owner::Foreign ? SendingPhase::NumberTaken : endEarly();
     const QStringList files = lists.List4Hossarim.items();
-    if (m_journal)
-        keep(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
     m_silence.begin();
     m_left = static_cast<int>(files.size());
     for (int i = 0; i < files.size(); ++i) {
@@ -176,6 +175,8 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
         HttpPause();
         if (stopped())
             break;
+        if (i == 0 && m_journal)
+            keep(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
         post(files[i]);
         m_platform.pump.pump();
         m_events.progressed(i, lists.List4Hossarim.count());
@@ -187,6 +188,10 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
     return endEarly();
 }
 
+bool HttpSender::isEntered() const {
+    return !m_folderOwner.claims() || (m_journal && m_journal->state().folderMadeByUs);
+}
+
 void HttpSender::post(const QString& path) {
     const DrivePath folder = DrivePath(path).folder();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
@@ -195,11 +200,13 @@ void HttpSender::post(const QString& path) {
     m_arrival.postBegins(path);
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     const bool cut = m_script.failed() && !m_script.failedBeforeSending();
+    // A file that was refused stays in hand; whether it has arrived is for the list to tell.
+    const bool unconfirmed = cut || m_script.refused();
     if (cut)
         m_arrival.postCut(path);
-    else if (!m_script.failed())
+    else if (!m_script.failed() && !unconfirmed)
         m_arrival.postConfirmed(path);
-    if (m_journal && !cut && !m_arrival.isLeftBehind(path))
+    if (m_journal && !unconfirmed && !m_arrival.isLeftBehind(path))
         keep(m_journal->release(path));
     m_silence.connectsTimedOut(cut && m_script.lastFailure().kind == Failure::Kind::TimedOut);
     m_events.reached(SendingMoment::Answered);
@@ -265,7 +272,7 @@ void HttpSender::compare(int listNumber) {
     m_verdict = CheckOrderOnServer(listNumber);
     const HttpArrival::Listed there{lists.ListAfterWeb.items(), uploadsAddress()};
     m_owner = m_journal && !stopped()
-                  ? m_folderOwner.of(*m_journal, ReadServerAnswer(lists.TxtWeb, folderName()), there.uploads)
+                  ? m_folderOwner.of(*m_journal, ReadServerAnswer(m_folderAnswer, folderName()), there.uploads)
                   : Owner::NotKnown;
     const QStringList order = lists.List4Kvazim.items();
     QStringList missing = lists.List4Hossarim.items();
@@ -286,6 +293,7 @@ void HttpSender::compare(int listNumber) {
 ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     lists.ListAfterWeb.clear();
     lists.TxtWeb.clear();
+    m_folderAnswer.clear();
     DrivePath& order = m_state.transfer.OrderFolder;
     if (order.text().endsWith(u'\\'))
         order = order.folder();
@@ -326,7 +334,9 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
     HttpPause(2);
     lists.TxtFromWeb.clear();
     HttpPause(2);
-    lists.TxtWeb = FetchUrl(listScript(folderName()));
+    const Result<WebAnswer> answer = m_platform.internet.fetch(listScript(folderName()));
+    lists.TxtWeb = answer ? AnsiCodePage::decode(answer->body) : QString();
+    m_folderAnswer = answer && answer->good() ? lists.TxtWeb : QString();
     m_events.reached(SendingMoment::Answered);
     HttpPause(3);
     m_platform.pump.pump();
@@ -359,8 +369,12 @@ void HttpSender::downloadList(int listNumber) {
     HttpPause(3);
     const auto size = files.size(list);
     if (cleared && size && *size <= largestList) {
-        if (const auto text = files.read(list))
+        if (const auto text = files.read(list)) {
             lists.TxtFromWeb = lists.TxtWeb = AnsiCodePage::decode(*text);
+            // A list file lies in the folder: only the script can tell that there is no folder.
+            if (!TellsUnknownFolder(lists.TxtWeb))
+                m_folderAnswer = lists.TxtWeb;
+        }
     }
 }
 
@@ -372,9 +386,11 @@ std::optional<bool> HttpSender::hasFolder(const QString& name) {
     if (stopped() || ++m_namesAsked > mostNames)
         return std::nullopt;
     const OnLine line(*this);
-    const Result<QByteArray> answer = m_platform.internet.fetch(listScript(name));
+    const Result<WebAnswer> answer = m_platform.internet.fetch(listScript(name));
     m_platform.pump.pump();
-    return answer && !stopped() ? std::optional(!TellsUnknownFolder(AnsiCodePage::decode(*answer))) : std::nullopt;
+    return answer && answer->good() && !stopped()
+               ? std::optional(!TellsUnknownFolder(AnsiCodePage::decode(answer->body)))
+               : std::nullopt;
 }
 
 bool HttpSender::onlyReportIsLeft() const {

@@ -110,6 +110,7 @@ private:
     using Owner = HttpFolderOwner::Owner;
 
     void compare(int listNumber);
+    bool isEntered() const; // the folder needs no further question whose it is
     bool stopped() const { return m_stop.left || m_stop.StopFlag; }
     void endSilent();
     std::optional<SendingPhase> endEarly();
@@ -142,7 +143,8 @@ private:
     ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check
     int m_left = 0;                                       // files of the pass not yet posted
     bool m_allPosted = true;                              // every file of the last pass was posted
-    Failure m_listFailure; // failure of the last list file's download; no message after success
+    QString m_folderAnswer; // the last one that may tell whose the folder is; none where the server answered badly
+    Failure m_listFailure;  // failure of the last list file's download; no message after success
 };
 
 } // namespace lumora

@@ -17,6 +17,10 @@ bool namesTotal(const QString& entry) {
     return entry.contains(total, Qt::CaseInsensitive);
 }
 
+bool hasNot(const QString& answer) {
+    return answer.contains(u"not"_s, Qt::CaseInsensitive);
+}
+
 bool isServersList(const QString& name) {
     bool isList = name == SecondListName();
     for (int number = 0; !isList && !ListFileName(number).isEmpty(); ++number)
@@ -69,16 +73,15 @@ QStringList MarkHossarim(const QStringList& files, const QStringList& entries, c
 }
 
 bool TellsUnknownFolder(const QString& answer) {
-    return answer.contains(u"not"_s, Qt::CaseInsensitive);
+    const QString text = answer.trimmed();
+    return hasNot(text) && text.size() <= longestAnswer && !text.contains(u'<') && !text.contains(u"~~"_s);
 }
 
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {
     ServerAnswer read;
-    if (TellsUnknownFolder(answer)) {
-        read.files.emplace();
+    read.files = TellsUnknownFolder(answer) ? QStringList() : filesIn(answer, folderName);
+    if (hasNot(answer))
         return read;
-    }
-    read.files = filesIn(answer, folderName);
     read.entries = ParseServerList(answer);
     read.namesFolder = std::any_of(read.entries.begin(), read.entries.end(),
                                    [&](const QString& entry) { return entry.trimmed() == folderName; });

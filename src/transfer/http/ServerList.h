@@ -37,6 +37,8 @@ struct ServerAnswer {
     // not tell. A listing that is too short to have entries can still tell of an empty folder.
     std::optional<QStringList> files;
 };
+// A script's words that it has no such folder: "not" in a text of at most 35 characters that is neither a list nor a
+// page of a web server.
 bool TellsUnknownFolder(const QString& answer);
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName);
 

@@ -66,8 +66,16 @@ void UploadForm::fetchTestListing() {
     run([this] { m_sender.fetchTestListing(); });
 }
 
+// The check goes by names alone; what is to be sent stays as the sending found it.
 void UploadForm::checkOrder() {
-    run([this] { m_sender.lists.TxtWeb = QString::number(static_cast<int>(m_sender.CheckOrderOnServer(0))); });
+    run([this] {
+        const TextList missing = lists().List4Hossarim;
+        const std::optional<int> left = m_left;
+        m_sender.lists.TxtWeb = QString::number(static_cast<int>(m_sender.CheckOrderOnServer(0)));
+        m_sender.lists.List4Hossarim = missing;
+        m_left = left;
+        showLeft();
+    });
 }
 
 void UploadForm::fetchListFile() {

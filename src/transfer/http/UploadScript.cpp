@@ -57,6 +57,7 @@ Result<QByteArray> UploadScript::bodyOf(const QStringList& files, const DrivePat
     auto body = readParts(files, localFolder);
     m_failure = body ? Failure{} : body.failure();
     m_fileFault = !body;
+    m_refused = false;
     return body;
 }
 
@@ -90,7 +91,8 @@ QString UploadScript::MultipartPost(const QString& folderName, const QStringList
         m_failure = answer.failure();
         return {};
     }
-    return AnsiCodePage::decode(*answer);
+    m_refused = !answer->good();
+    return AnsiCodePage::decode(answer->body);
 }
 
 QString UploadScript::MultipartPostInet(const QString& folderName, const QStringList& files, const QString& server,
@@ -103,8 +105,9 @@ QString UploadScript::MultipartPostInet(const QString& folderName, const QString
         request.body = std::move(*body);
         request.announcedLength = 2 * request.body.size() - 1;
         const auto answer = m_platform.internet.post(u"http://"_s + server + address(url, folderName, extra), request);
+        m_refused = answer && !answer->good();
         if (answer)
-            return AnsiCodePage::decode(*answer);
+            return AnsiCodePage::decode(answer->body);
         m_failure = answer.failure();
     }
     return u"Error: "_s + m_failure.message;

@@ -46,6 +46,8 @@ public:
     // Of the last call; the message is empty after success.
     const Failure& lastFailure() const { return m_failure; }
     bool failed() const { return !m_failure.message.isEmpty(); }
+    // True when the last call was answered outside 200 to 299; whether the files are stored is not known.
+    bool refused() const { return m_refused; }
     // True when a file on this machine failed and nothing was sent.
     bool failedBeforeSending() const { return m_fileFault; }
 
@@ -57,6 +59,7 @@ private:
     const Platform& m_platform;
     Failure m_failure;
     bool m_fileFault = false;
+    bool m_refused = false;
 };
 
 } // namespace lumora

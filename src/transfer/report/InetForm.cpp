@@ -23,8 +23,8 @@ InetForm::InetForm(const SessionState& state, const Platform& platform, PageChai
 QString InetForm::FetchUrlSmall(const QString& url) {
     if (!m_platform.internet.open())
         m_platform.dialogs.message(m_state.wording(u"אין תקשורת"_s, u"No communication"_s));
-    const auto body = m_platform.internet.fetch(url);
-    return body ? AnsiCodePage::decode(*body) : QString();
+    const auto answer = m_platform.internet.fetch(url);
+    return answer ? AnsiCodePage::decode(answer->body) : QString();
 }
 
 void InetForm::report() {
