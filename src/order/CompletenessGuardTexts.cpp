@@ -4,8 +4,6 @@
 #include "platform/Platform.h"
 #include "session/SessionState.h"
 
-#include <algorithm>
-
 namespace lumora {
 
 void CompletenessGuard::tellNoPicture() const {
@@ -19,7 +17,7 @@ bool CompletenessGuard::askForFewer(const OrderCompleteness& counts) const {
             .wording(u"לפי הרישום יש בהזמנה %1 תמונות, ורק %2 מהן יישלחו. לשלוח בכל זאת?",
                      u"The order's log names %1 pictures, and only %2 of them would be sent. Send all the same?")
             .arg(counts.named.value_or(0))
-            .arg(std::min(counts.present, counts.marked)));
+            .arg(counts.sent()));
 }
 
 } // namespace lumora

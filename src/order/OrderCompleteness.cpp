@@ -55,12 +55,11 @@ QStringList PrintsAmong(const QStringList& names) {
 }
 
 OrderCompleteness::Verdict OrderCompleteness::verdict() const {
-    const int sent = std::min(present, marked);
-    if (sent == 0)
+    if (sent() == 0)
         return Verdict::None;
     if (!named)
         return Verdict::Unknown;
-    return sent < *named ? Verdict::Fewer : Verdict::Whole;
+    return sent() < *named ? Verdict::Fewer : Verdict::Whole;
 }
 
 OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& present, const QStringList& marked) {

@@ -3,6 +3,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <algorithm>
 #include <optional>
 
 namespace lumora {
@@ -17,6 +18,7 @@ struct OrderCompleteness {
     std::optional<int> named;
     int present = 0; // in the folder
     int marked = 0;  // among what is to be sent
+    int sent() const { return std::min(present, marked); }
 
     enum class Verdict {
         None,    // no print would be sent

@@ -57,6 +57,9 @@ std::optional<OrderFolder> ReplacementOf(const SessionState& state, const Files&
 // order of its own; one stays while a picture of this order has failed, since it may hold the only print.
 Result<void> RemoveReplacedOrder(const Files& files, OrderJournal& order);
 
+// "2 of 5 pictures are no longer where they were.", and the question before an order is thrown away.
+QString GoneText(const SessionState& state, const UnfinishedOrder& order);
+QString ThrowAwayQuestion(const SessionState& state, const QString& number);
 // Removes the order's folder with all that it holds.
 Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder);
 

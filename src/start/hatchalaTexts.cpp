@@ -82,10 +82,7 @@ void hatchala::showOffer() {
 QString hatchala::offerText(const UnfinishedOrder& order) const {
     const QString& number = order.state.number;
     if (m_asksForGone)
-        return m_state
-            .wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
-            .arg(order.gone)
-            .arg(order.pictures);
+        return GoneText(m_state, order);
     switch (order.state.phase) {
     case OrderState::Phase::Preparing:
         return m_state
@@ -117,10 +114,7 @@ QString hatchala::offerText(const UnfinishedOrder& order) const {
 }
 
 bool hatchala::asksToThrowAway(const QString& number) {
-    return m_platform.dialogs.ask(m_state
-                                      .wording(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
-                                               u"Throw order number %1 away? It can't be brought back.")
-                                      .arg(number));
+    return m_platform.dialogs.ask(ThrowAwayQuestion(m_state, number));
 }
 
 void hatchala::setHelp() {

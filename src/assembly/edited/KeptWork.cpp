@@ -43,9 +43,9 @@ Result<void> KeptWork::keep(const DrivePath& file) const {
 void KeptWork::bringBack() const {
     for (const DrivePath& scratch : {WorkspacePaths::tempred(m_state), WorkspacePaths::jobFolder(m_state)}) {
         const DrivePath kept = KeptWorkFolder(m_folder, scratch);
+        // A picture that is missing here fails, and is named.
         for (const QString& name : m_files.names(kept, u"*"_s))
-            static_cast<void>(
-                m_files.keepCopy(kept / name, scratch / name)); // a picture that is missing here fails, and is named
+            static_cast<void>(m_files.keepCopy(kept / name, scratch / name));
     }
 }
 

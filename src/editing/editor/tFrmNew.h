@@ -236,6 +236,7 @@ private:
     void takeFrame();
     void removeFrame();
     void showFrames(bool on);
+    void tellFrameTakenOut();
     const std::optional<Bitmap>& frame(const EditFields& fields);
     void stepLineStyle(int places);
     void moveMarker(QPointF at);

@@ -94,9 +94,7 @@ void tFrmNew::showFrames(bool on) {
     Misgerett.checked = on;
     if (m_open && !on && m_seenFrame.takeOut(m_edit)) {
         packRenderStore();
-        m_platform.dialogs.message(m_state.wording(
-            u"המסגרת הוסרה מהתמונה ולא תודפס. כדי להחזיר אותה יש לבחור אותה שוב"_s,
-            u"The frame was taken off the picture and will not be printed. Choose it again to bring it back"_s));
+        tellFrameTakenOut();
     } else if (m_open) {
         RenderPreview();
     }

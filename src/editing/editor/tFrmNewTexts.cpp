@@ -98,4 +98,10 @@ QString tFrmNew::hintLine(const Caption& button) {
     return hint.isEmpty() || hint == name ? name : name + u": "_s + hint;
 }
 
+void tFrmNew::tellFrameTakenOut() {
+    m_platform.dialogs.message(m_state.wording(
+        u"המסגרת הוסרה מהתמונה ולא תודפס. כדי להחזיר אותה יש לבחור אותה שוב"_s,
+        u"The frame was taken off the picture and will not be printed. Choose it again to bring it back"_s));
+}
+
 } // namespace lumora

@@ -44,7 +44,7 @@ public:
     // Turns the work picture grey; twice would darken it twice.
     void turnGrey();
 
-    // As the function below.
+    // As the function of PicturePlacement.h, in this picture's box.
     void placeAtCentreIfUnset(EditFields& edit) const { lumora::placeAtCentreIfUnset(edit, m_box); }
 
     // True when no part of the paper is bare, and when at least a pixel of the picture lies on it.

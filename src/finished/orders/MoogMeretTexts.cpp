@@ -85,10 +85,7 @@ void MoogMeret::tellNotFinished() {
 }
 
 void MoogMeret::tellGone(const UnfinishedOrder& order) {
-    m_platform.dialogs.message(
-        m_state.wording(u"%1 מתוך %2 התמונות אינן עוד במקומן.", u"%1 of %2 pictures are no longer where they were.")
-            .arg(order.gone)
-            .arg(order.pictures));
+    m_platform.dialogs.message(GoneText(m_state, order));
 }
 
 bool MoogMeret::asksToFinish() {
@@ -101,14 +98,12 @@ bool MoogMeret::asksToSendWithoutDetails() {
 }
 
 bool MoogMeret::asksToGoOnWithoutGone(const UnfinishedOrder& order) {
-    return asks(u"%1 מתוך %2 התמונות אינן עוד במקומן. להמשיך בלעדיהן?",
-                u"%1 of %2 pictures are no longer where they were. Go on without them?",
-                {QString::number(order.gone), QString::number(order.pictures)});
+    return m_platform.dialogs.ask(GoneText(m_state, order) +
+                                  m_state.wording(u" להמשיך בלעדיהן?", u" Go on without them?"));
 }
 
 bool MoogMeret::asksToThrowAway(const QString& number) {
-    return asks(u"לזרוק את הזמנה מספר %1? לא ניתן להחזיר אותה.",
-                u"Throw order number %1 away? It can't be brought back.", {number});
+    return m_platform.dialogs.ask(ThrowAwayQuestion(m_state, number));
 }
 
 void MoogMeret::showWhatIsMarked() {

@@ -93,9 +93,7 @@ std::span<const PhaseLook> UploadForm::looks() const {
 
 QString UploadForm::advice(const PhaseLook& row) const {
     if (row.phase == SendingPhase::AllThere && m_lacking)
-        return wording(fewerArrived)
-            .arg(std::min(m_lacking->present, m_lacking->marked))
-            .arg(m_lacking->named.value_or(0));
+        return wording(fewerArrived).arg(m_lacking->sent()).arg(m_lacking->named.value_or(0));
     return wording(row.advice);
 }
 

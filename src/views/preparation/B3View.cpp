@@ -15,8 +15,8 @@ B3View::B3View(B3& page, const SessionState& state, const Theme& theme)
     const Card picture = makeCard("card", Pad::Slim);
     picture.column->addWidget(m_picture, 1);
     m_pictureCard = picture.frame;
-    m_list = listing(
-        c.List2, [](const QString& name) { return fromLeft(name.trimmed()); }); // the picture in work is the marked one
+    // The picture in work is the marked one.
+    m_list = listing(c.List2, [](const QString& name) { return fromLeft(name.trimmed()); });
     m_list->setAttribute(Qt::WA_TransparentForMouseEvents);
     const Card names = makeCard("card", Pad::Slim);
     names.column->addWidget(m_list, 1);
