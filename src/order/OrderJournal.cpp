@@ -26,10 +26,21 @@ Way wayOf(Sender by) {
 OrderJournal::OrderJournal(const Files& files, OrderFolder folder)
     : m_files(files)
     , m_folder(std::move(folder)) {
-    if (const Result<OrderState> read = ReadOrderState(m_files, m_folder)) {
+    const Result<OrderState> read = ReadOrderState(m_files, m_folder);
+    if (read) {
         m_state = *read;
         m_known = m_kept = true;
+    } else if (read.failure().kind != Failure::Kind::NotFound) {
+        expectTheWorst();
     }
+}
+
+// What the state told can't be read: any file may have been cut in a put, and the lab may have been told.
+void OrderJournal::expectTheWorst() {
+    makeKnown();
+    for (const QString& name : m_files.names(m_folder.path(), u"*"_s))
+        m_state.filesInHand += m_folder.filePath(name).text();
+    m_state.report = OrderState::Report::Begun;
 }
 
 void OrderJournal::makeKnown() {
@@ -81,11 +92,11 @@ Result<void> OrderJournal::prepared() {
 Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
     makeKnown();
     OrderState next = m_state;
-    next.folderMadeByUs = next.folderMadeByUs || ours;
     next.makesFolder = false;
     next.phase = std::max(next.phase, Phase::Sending);
     if (next.way == Way::Station || next.way == Way::Mail)
         next.way = wayOf(by);
+    next.folderMadeByUs = next.folderMadeByUs || (ours && next.way == wayOf(by));
     const Result<void> kept = keep(next);
     if (kept) {
         const DrivePath aside = m_folder.keptWorkPath();
@@ -93,6 +104,10 @@ Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
             static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
     }
     return kept;
+}
+
+bool OrderJournal::ownsFolder(Sender by) const {
+    return m_state.folderMadeByUs && m_state.way == wayOf(by);
 }
 
 Result<void> OrderJournal::folderIsAsked() {

@@ -35,6 +35,8 @@ public:
     // preparation. ours: this order has made it, or it is known to hold nothing of another order. An order that has
     // arrived stays so.
     Result<void> sendingBegins(Sender by, bool ours);
+    // The folder on this sender's server is known as the order's own. One that was made for the other sender is not.
+    bool ownsFolder(Sender by) const;
     // The server is about to be asked to make the folder; it has refused.
     Result<void> folderIsAsked();
     Result<void> folderIsRefused();
@@ -59,6 +61,7 @@ public:
     Result<void> replacesNone();
 
 private:
+    void expectTheWorst();
     void makeKnown();
     Result<void> keep(const OrderState& next);
 

@@ -65,7 +65,7 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
     if (state.phase == Phase::Reported || !canBeSent(session, state))
         return false;
     if (state.phase == Phase::Arrived)
-        return state.report == OrderState::Report::NotYet;
+        return state.report == OrderState::Report::NotYet && !state.sentBefore;
     if (state.fewerAgreed || state.sentBefore)
         return false;
     const QStringList names = files.names(order.folder.path(), u"*"_s);

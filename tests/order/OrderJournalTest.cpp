@@ -91,12 +91,23 @@ TEST_F(AJournal, makesAStateForAnOrderThatHasNoneAtItsFirstStep) {
     EXPECT_EQ(stored().way, Way::Http);
     EXPECT_FALSE(stored().folderMadeByUs);
 
-    give(u".order"_s); // damaged
-    EXPECT_FALSE(OrderJournal(test.files, folder).known());
+    give(u".order"_s); // damaged: any file may have been cut, and the lab may have been told
+    const OrderJournal damaged(test.files, folder);
+    EXPECT_EQ(damaged.state().filesInHand, QStringList(folder.filePath(u"!105_1234.jpg"_s).text()));
+    EXPECT_EQ(damaged.state().report, OrderState::Report::Begun);
     const OrderFolder pieces(u"C:\\2026_11_21_KUP_1234^106P"_path);
     ASSERT_TRUE(test.files.makeFolder(pieces.path()));
     ASSERT_TRUE(OrderJournal(test.files, pieces).sendingBegins(Sender::Ftp, false));
     EXPECT_EQ(ReadOrderState(test.files, pieces)->number, u"106"_s);
+}
+
+TEST_F(AJournal, knowsTheFolderOfTheServerOnWhichItWasMade) {
+    give(u"!105_1234.jpg"_s);
+    OrderJournal journal(test.files, folder);
+    ASSERT_TRUE(journal.sendingBegins(Sender::Ftp, true));
+    EXPECT_FALSE(journal.ownsFolder(Sender::Ftp) || journal.ownsFolder(Sender::Http)) << "made for the other sender";
+    ASSERT_TRUE(journal.sendingBegins(Sender::Http, true));
+    EXPECT_TRUE(journal.ownsFolder(Sender::Http) && !journal.ownsFolder(Sender::Ftp));
 }
 
 TEST_F(AJournal, takesAwayWhatWasKeptAsideWhenTheSendingBegins) {

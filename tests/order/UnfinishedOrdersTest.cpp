@@ -122,6 +122,7 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::fewerAgreed},
         {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::sentBefore},
         {Phase::Arrived, Way::Http, Report::NotYet, false, true}, // the lab alone is to be told
+        {Phase::Arrived, Way::Http, Report::NotYet, true, false, &OrderState::sentBefore}, // the lab may have been told
         {Phase::Arrived, Way::Ftp, Report::Begun, true, false},
         {Phase::Reported, Way::Ftp, Report::Done, true, false},
     };

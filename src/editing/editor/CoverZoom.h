@@ -22,6 +22,8 @@ public:
     void forget() { m_own.reset(); }
 
 private:
+    bool isRaisedToTheLast(const EditFields& edit) const;
+
     const SessionState& m_state;
     std::optional<std::int16_t> m_own; // the customer's zoom while a raised one stands in the record
 };

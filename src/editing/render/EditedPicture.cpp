@@ -215,13 +215,12 @@ bool EditedPreview::touchesPaper(const EditFields& edit) const {
 }
 
 std::int16_t EditedPreview::coveringZoom(EditFields edit) const {
-    constexpr std::int16_t largest = 210;
     const PrintGeometry print = printGeometry(m_paper, orientationOf(m_file));
-    for (; edit.ZoomPercent < largest; ++edit.ZoomPercent) {
+    for (; edit.ZoomPercent < largestCoveringZoom; ++edit.ZoomPercent) {
         if (coversPaper(edit) && printPlacement(m_file, print, edit).covers(print.size))
             return edit.ZoomPercent;
     }
-    return largest;
+    return largestCoveringZoom;
 }
 
 void EditedPreview::setBackground(QColor colour) {

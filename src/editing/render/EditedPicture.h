@@ -51,7 +51,8 @@ public:
     bool coversPaper(const EditFields& edit) const;
     bool touchesPaper(const EditFields& edit) const;
     // The smallest zoom from the record's on with which the picture covers the paper, in the preview and in the print;
-    // 210 where none does.
+    // the largest where none does.
+    static constexpr std::int16_t largestCoveringZoom = 210; // per cent
     std::int16_t coveringZoom(EditFields edit) const;
 
     // What an uncovered part of the paper shows; without it the whole picture, stretched.

@@ -24,7 +24,7 @@ FtpFolderOwner::Owner FtpFolderOwner::of(const OrderJournal& order, FtpConnectio
                                          const FtpListing& listing) const {
     if (!asks())
         return Owner::NotAsked;
-    if (order.state().folderMadeByUs)
+    if (order.ownsFolder(Sender::Ftp))
         return Owner::Ours;
     const QString log = order.folder().logPath().leaf();
     const auto isNamed = [](const FtpEntry& entry) {

@@ -169,6 +169,11 @@ void FtpSender::takeBroken() {
     const OrderJournal& journal = *session.journal();
     const QStringList reported = ReadBrokenFiles(m_platform.files, journal.folder());
     QStringList inHand = journal.state().filesInHand;
+    // The list of broken files is written anew by this sending, which may be one of other files.
+    for (const QString& path : reported) {
+        if (!lists.List3.contains(path))
+            session.keep(session.journal()->take(path));
+    }
     for (const QString& path : reported + inHand) {
         if (lists.List3.contains(path) && !lists.List4Broken.contains(path))
             lists.List4Broken.append(path);
@@ -229,7 +234,7 @@ Arrival FtpSender::arrival(SendingPhase end) const {
         return Arrival::Part;
     if (session.provesArrival())
         return check.proven;
-    return check.restOfOrder().isEmpty() ? Arrival::Whole : Arrival::Part;
+    return check.arrivalByNames();
 }
 
 SendingPhase FtpSender::arrivedEnd() const {

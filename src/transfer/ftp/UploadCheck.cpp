@@ -180,7 +180,7 @@ void UploadCheck::prove() {
 QStringList UploadCheck::restOfOrder() const {
     const OrderFolder order(m_transfer.OrderFolder);
     const QStringList entries = m_files.names(order.path(), u"*.gbr;*.jpp;*.prk"_s);
-    QStringList rest = FtpOrderFiles(m_files, order, entries, m_transfer.Mefurak == Travel::Pieces);
+    QStringList rest = FtpOrderFiles(m_files, order, entries, TravelsInPieces(order.name()));
     rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
     return rest;
 }
@@ -199,7 +199,19 @@ Arrival UploadCheck::orderThere() {
     if (const Result<QByteArray> bytes = m_files.read(order.logPath()))
         log.read(*bytes);
     const QStringList there = m_lists.List6.items();
-    switch (OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict()) {
+    return arrivalBy(OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict());
+}
+
+Arrival UploadCheck::arrivalByNames() const {
+    if (!restOfOrder().isEmpty())
+        return Arrival::Part;
+    return arrivalBy(
+        OrderCompleteness::read(m_files, OrderFolder(m_transfer.OrderFolder), LeafNames(m_lists.List4Makor.items()))
+            .verdict());
+}
+
+Arrival UploadCheck::arrivalBy(OrderCompleteness::Verdict verdict) {
+    switch (verdict) {
     case OrderCompleteness::Verdict::Whole:
     case OrderCompleteness::Verdict::Unknown:
         return Arrival::Whole;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/OrderCompleteness.h"
 #include "platform/Platform.h"
 #include "transfer/delivery/SilenceLimit.h"
 #include "transfer/ftp/FtpSession.h"
@@ -47,8 +48,8 @@ public:
     std::optional<ArrivalProof> proof;
     // With the proof: how much of the order lies there, also where the sending is only a part of it.
     Arrival proven = Arrival::Part;
-    // Full paths of the order's files that are not among those of the sending.
-    QStringList restOfOrder() const;
+    // How much has arrived where the files of the sending have, each by its name alone.
+    Arrival arrivalByNames() const;
 
     // Files of the order that are not on the server, or there only as the remains of a failed put; by the proof, where
     // there is one.
@@ -63,6 +64,9 @@ private:
     bool lookUp();
     void prove();
     Arrival orderThere();
+    // Full paths of the order's files that are not among those of the sending.
+    QStringList restOfOrder() const;
+    static Arrival arrivalBy(OrderCompleteness::Verdict verdict);
     bool isThere(const QString& name) const;
     void filterDots();
     void count();

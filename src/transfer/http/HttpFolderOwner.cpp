@@ -17,7 +17,7 @@ bool HttpFolderOwner::claims() const {
 
 HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const ServerAnswer& answer,
                                            const QString& uploads) const {
-    if (!m_state.Careful || order.state().folderMadeByUs)
+    if (!m_state.Careful || order.ownsFolder(Sender::Http))
         return Owner::Ours;
     if (!answer.files)
         return Owner::NotKnown;

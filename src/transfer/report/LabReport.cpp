@@ -82,7 +82,10 @@ void LabReport::watch() {
 }
 
 bool LabReport::mayTellAgain() const {
-    return m_order && m_order->state().report != Report::NotYet;
+    if (!m_order)
+        return false;
+    const OrderState& order = m_order->state();
+    return order.report != Report::NotYet || order.phase == OrderState::Phase::Arrived || order.fewerAgreed;
 }
 
 bool LabReport::isEndUnknown() const {

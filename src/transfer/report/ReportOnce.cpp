@@ -48,7 +48,7 @@ ReportOnce::Told ReportOnce::tell(Sender by, ReportCalls& calls) {
 }
 
 bool ReportOnce::isDueWhereFound(Sender by) const {
-    return m_state.Careful && !toldOrUnwanted() && isWanted(by);
+    return m_state.Careful && !m_journal.state().sentBefore && !toldOrUnwanted() && isWanted(by);
 }
 
 void ReportOnce::endsUntold() {
