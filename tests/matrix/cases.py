@@ -13,6 +13,7 @@ from servers import ACCOUNT, PASSWORD, RealFtp, ScriptedFtp, WebLab, listen
 
 PICTURES = 3
 HERE = 'the order on this machine'
+OWN = ('kashloo.txt', 'filelisthom.txt')    # the program's, which never travel
 SMALL = 'arrived, the small picture damaged'
 FOLDER = pathlib.Path(__file__).resolve().parent
 LAB = (FOLDER / 'lab.ini.in').read_text()
@@ -62,7 +63,7 @@ class Workspace:
         """Name -> bytes of all that has to arrive."""
         order = order or self.order()
         files = {path.name: path.read_bytes() for path in order.iterdir()
-                 if path.is_file() and path.name[0] != '.' and path.name not in ('kashloo.txt', 'filelisthom.txt')} if order else {}
+                 if path.is_file() and path.name[0] != '.' and path.name not in OWN} if order else {}
         proof = self.data / '2000lumora/000.jpg'
         if self.way == 'ftp' and proof.is_file():
             files['000.jpg'] = proof.read_bytes()

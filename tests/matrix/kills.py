@@ -72,8 +72,8 @@ class Kill(Case):
         place = f'rename {at} ({made})' if made else f'file {at}'
         super().__init__(tools, number, way, server, Fault(f'{ORDERS[order, way]}, {point} {place}'), careful)
         self.part, self.order_of, self.point, self.place = 'kill', order, point, place
-        # A file whose put was in hand is sent again, but for one of which an FTP server tells the whole length with Careful.
-        self.fault.again = 0 if careful and way == 'ftp' else 1
+        # With Careful the server is asked for the length of a file whose put was in hand.
+        self.fault.again = 0 if careful else 1
         self.environment = {'MATRIX_KILL': str(at if point == 'before' else -at)} if made else {}
         if not made:
             act = getattr(self, way + '_' + point.replace(' ', '_'))

@@ -17,8 +17,8 @@ class Pair(Case):
     """Two orders, each with its own pictures; each has to arrive whole in a folder of its own and to be reported once."""
 
     def __init__(self, tools, number, name, play, order, way, server, careful):
-        super().__init__(tools, number, way, server, Fault(f'{name}, {ORDERS[order, way]}', literal=EXCLUSIVE if way == 'http' and play is one_serial_empty_folder else ''),
-                         careful)
+        literal = EXCLUSIVE if way == 'http' and play is one_serial_empty_folder else ''
+        super().__init__(tools, number, way, server, Fault(f'{name}, {ORDERS[order, way]}', literal=literal), careful)
         self.part, self.order_of, self.plays = 'pair', order, play
         self.other = Workspace(self.folder, tools, way, 'other')
         self.other.data = None
@@ -99,7 +99,7 @@ class Pair(Case):
             return 'not whole on its own machine'
         there = self.arrived / order.name
         local = workspace.files(order)
-        remote = {path.name: path.read_bytes() for path in there.iterdir() if not path.name.startswith('filelist')} if there.is_dir() else {}
+        remote = {path.name: path.read_bytes() for path in there.glob('*') if not path.name.startswith('filelist')}
         # The small picture is one file a workspace and is proven by its name.
         whole = all(name in remote and (remote[name] == content or name == '000.jpg') for name, content in local.items())
         if workspace.told() == 'not':
