@@ -11,11 +11,12 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr std::array texts = {&OrderDetails::n1,   &OrderDetails::n2,      &OrderDetails::ppr,  &OrderDetails::Hearot,
-                              &OrderDetails::Mail, &OrderDetails::FillFit, &OrderDetails::maat, &OrderDetails::Bord};
+constexpr std::array textFields = {&OrderDetails::n1,     &OrderDetails::n2,   &OrderDetails::ppr,
+                                   &OrderDetails::Hearot, &OrderDetails::Mail, &OrderDetails::FillFit,
+                                   &OrderDetails::maat,   &OrderDetails::Bord};
 
 void setAll(OrderDetails& details, const QString& text) {
-    for (const auto field : texts)
+    for (const auto field : textFields)
         details.*field = text;
     details.TotalPics = 0;
 }
@@ -31,7 +32,7 @@ std::optional<OrderLog> readLog(const Files& files, const DrivePath& path, Order
     log.shemot = details;
     log.read(*bytes);
     if (log.layout != OrderLog::Layout::Album) {
-        for (const auto field : texts)
+        for (const auto field : textFields)
             details.*field = log.shemot.*field;
         details.TotalPics = log.shemot.TotalPics;
     }
