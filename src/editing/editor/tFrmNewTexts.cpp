@@ -1,5 +1,7 @@
 // All texts of the editor, in both languages.
 #include "editing/editor/tFrmNew.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
 #include "session/CaptionTexts.h"
 
 namespace lumora {
