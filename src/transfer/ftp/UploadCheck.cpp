@@ -6,6 +6,7 @@
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
 #include "order/OrderLog.h"
+#include "order/OrderNames.h"
 #include "platform/Machine.h"
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
