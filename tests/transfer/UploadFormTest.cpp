@@ -240,11 +240,11 @@ TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
                     order.page().Command10_Click();
                     order.countDown();
                 } else {
-                    order.send();
+                    order.start();
+                    order.countDown();
                 }
-                UploadForm& page = order.page();
                 if (each.ours || !careful) {
-                    EXPECT_EQ(page.phase(), SendingPhase::Success);
+                    EXPECT_EQ(order.page().phase(), SendingPhase::Success);
                     EXPECT_EQ(ReadOrderState(order.test.files, OrderFolder(UploadFormRig::folder()))->folderMadeByUs,
                               careful || each.postedInto);
                     continue;
@@ -252,9 +252,9 @@ TEST_F(UploadFormTest, NothingIsPostedIntoTheFolderOfAnotherOrder) {
                 EXPECT_EQ(other.posted, QStringList());
                 EXPECT_EQ(other.uploads[name], before);
                 if (!free) {
-                    EXPECT_EQ(page.phase(), SendingPhase::CallLab);
-                    EXPECT_TRUE(page.controls().Label4Reason.text.contains(u"הזמנה אחרת"_s));
-                    EXPECT_TRUE(page.controls().Label1.text.isEmpty()) << "there were no three attempts";
+                    EXPECT_EQ(order.page().phase(), SendingPhase::CallLab);
+                    EXPECT_TRUE(order.page().controls().Label4Reason.text.contains(u"הזמנה אחרת"_s));
+                    EXPECT_TRUE(order.page().controls().Label1.text.isEmpty()) << "there were no three attempts";
                     continue;
                 }
                 EXPECT_EQ(order.chain.front()->id(), PageId::Form2);
