@@ -118,6 +118,9 @@ TEST(StartPage, HelpsAMouseAFingerAndTheKeyboard) {
         QString helps;
         for (const QString& name : {u"Image1"_s, u"Image11"_s, u"Image5"_s, u"Image3"_s, u"Image6"_s}) {
             mouseGoes(walk, name, true);
+            QFocusEvent focusGoes(QEvent::FocusOut);
+            QApplication::sendEvent(&walk.control(name == u"Image5"_s ? u"Image1"_s : u"Image5"_s), &focusGoes);
+            walk.settle();
             helps += shown();
             EXPECT_EQ(walk.control(u"Picture3"_s).isVisible(), !english);
             mouseGoes(walk, name, false);

@@ -188,7 +188,8 @@ bool hatchalaView::eventFilter(QObject* watched, QEvent* event) {
             break;
         case QEvent::Leave:
         case QEvent::FocusOut:
-            m_page.MouseMove(hatchala::Hover::Nothing);
+            if (m_page.hover() == over) // the focus of another control takes no help away
+                m_page.MouseMove(hatchala::Hover::Nothing);
             break;
         case QEvent::FocusIn: {
             const Qt::FocusReason why = static_cast<QFocusEvent*>(event)->reason();
