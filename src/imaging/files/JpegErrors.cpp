@@ -26,7 +26,8 @@ bool isHarmless(int warning) {
 }
 
 void onMessage(j_common_ptr info, int level) {
-    if (level < 0 && !isHarmless(info->err->msg_code))
+    const bool passes = reinterpret_cast<JpegErrors*>(info->err)->warningsPass || isHarmless(info->err->msg_code);
+    if (level < 0 && !passes)
         giveUp(info);
 }
 

@@ -21,6 +21,7 @@ struct JpegErrors {
     int code = 0; // libjpeg's message number, or 0
     QString text;
     bool outOfMemory = false;
+    bool warningsPass = false; // also those with which libjpeg invents part of the picture
 
     // Gives the manager for cinfo.err; called before the libjpeg object is created.
     jpeg_error_mgr* install();

@@ -152,10 +152,11 @@ JpegReader::JpegReader(std::unique_ptr<State> state)
 
 JpegReader::~JpegReader() = default;
 
-Result<std::unique_ptr<JpegReader>> JpegReader::open(PictureInput input) {
+Result<std::unique_ptr<JpegReader>> JpegReader::open(PictureInput input, Warnings warnings) {
     auto state = std::make_unique<State>(std::move(input));
     State& s = *state;
     s.info.err = s.errors.install();
+    s.errors.warningsPass = warnings == Warnings::Pass;
     const bool ok = s.errors.guarded([&s] {
         jpeg_create_decompress(&s.info);
         s.created = true;

@@ -10,11 +10,13 @@
 
 namespace lumora {
 
-// Reads one JPEG file. Errors of libjpeg are failures, and so are its warnings that data is missing or wrong.
+// Reads one JPEG file. Errors of libjpeg and a file that is cut short are failures, and so are, unless they pass, its
+// warnings that data is missing or wrong.
 class JpegReader {
 public:
+    enum class Warnings { Fail, Pass };
     // Reads the header.
-    static Result<std::unique_ptr<JpegReader>> open(PictureInput input);
+    static Result<std::unique_ptr<JpegReader>> open(PictureInput input, Warnings warnings = Warnings::Fail);
     ~JpegReader();
     JpegReader(const JpegReader&) = delete;
     JpegReader& operator=(const JpegReader&) = delete;
