@@ -174,6 +174,13 @@ enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
 // In which form the files of an order travel.
 enum class Travel : std::int16_t { Whole = 0, Pieces = 1 };
 
+// A chosen picture that is not in the order that was prepared, and why.
+struct LeftOut {
+    enum class Why : std::int16_t { NoJpeg, Name, Gone, Damaged, NotWritten };
+    DrivePath picture;
+    Why why = Why::Damaged;
+};
+
 // What the senders share.
 struct TransferState {
     DrivePath OrderFolder;     // of the order that is being prepared, sent or looked at
@@ -187,6 +194,8 @@ struct TransferState {
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;
     std::int16_t MailFlag = 0; // cleared at the start of each order
+    QList<LeftOut> leftOut;    // of the new order that is being prepared or sent
+    bool leftOutAsked = false; // the customer goes on without them
 };
 
 // The lines that one page copies into a list of the next, and what it asks the next page to do with them.
@@ -196,6 +205,9 @@ struct HandOver {
     QString notice;          // a line for the customer that the start page shows
     DrivePath takenUp;       // folder of the order whose preparation goes on; empty for a new order
     DrivePath replaced;      // folder of the order that the next one is prepared again from
+    QStringList basket;      // the lines that the page of pictures handed over, for the way back to it
+    QStringList pictures;    // all pictures that it offered
+    bool back = false;       // it takes both back
 };
 
 struct SessionState {
@@ -209,6 +221,7 @@ struct SessionState {
     bool TachanaMekomit = false;         // local station: the order stays in the workspace
     bool DoarReshut = false;             // the e-mail address is optional
     std::int16_t MediniyutDchisa = 2;    // deep compression of large prints: 1 ask, 2 always
+    bool DchisatAlbum = true;            // deep compression is for albums too
     std::int16_t DchisaAmoka = 0;        // 1: deep compression is on for this order
     std::int16_t SugTzad = 40;           // length of the tail of a print file, 40 or 60
     QString BranchChoice;                // caption of the collection point

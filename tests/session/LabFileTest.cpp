@@ -35,7 +35,8 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "JppTail = 60\nType = i\n"
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
-              "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = ask\n"
+              "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = "
+              "ask\nDeepCompressionAlbum = no\n"
               "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
@@ -59,7 +60,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(lab.GvulMuzag, 0);
     EXPECT_EQ(lab.TmunatPaar, 1);
     EXPECT_EQ(lab.profile.ReportOn, 0);
-    EXPECT_EQ(lab.MediniyutDchisa, 1);
+    EXPECT_TRUE(lab.MediniyutDchisa == 1 && !lab.DchisatAlbum);
     const MailAccount& mail = lab.profile.mail;
     EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
               QStringList({"mail.lab.example", "a@b", "x^y", "kiosk@lab.example", "o'neil+orders@lab.example"}));

@@ -30,8 +30,9 @@ void kyoskNew::checkAndClose() {
     Combo1.text = mailDomainPrompt(m_state.english());
     if (couponRefuses())
         return;
+    const bool mayBeDeep = plain() && (m_state.Optint != OrderKind::Album || m_state.DchisatAlbum);
     const DeepCompression deep =
-        plain() ? deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa) : DeepCompression::Off;
+        mayBeDeep ? deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa) : DeepCompression::Off;
     m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
     openClosingPanel();
     // The question is shown only together with the closing panel below it.

@@ -38,6 +38,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.profile = std::move(profile);
 
     state.MediniyutDchisa = deployment.MediniyutDchisa;
+    state.DchisatAlbum = deployment.DchisatAlbum;
     state.TachanaMekomit = deployment.TachanaMekomit;
     state.DoarReshut = deployment.DoarReshut;
     state.FitMuzag = deployment.FitMuzag;

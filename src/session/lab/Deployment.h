@@ -21,6 +21,7 @@ struct Deployment {
     bool TachanaMekomit = false;
     bool DoarReshut = false;
     std::int16_t MediniyutDchisa = 2;
+    bool DchisatAlbum = true;
     std::int16_t GvulMuzag = 1;
     bool FitMuzag = false;
     std::int16_t TmunatPaar = 0;

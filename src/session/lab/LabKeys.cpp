@@ -218,6 +218,7 @@ std::vector<Row> rows() {
         {"Switches", "OptionalMail", yesNo(at(&D::DoarReshut), true, false)},
         {"Switches", "DeepCompression",
          words<I>(at(&D::MediniyutDchisa), u"ask or always"_s, {{u"ask"_s, 1}, {u"always"_s, 2}})},
+        {"Switches", "DeepCompressionAlbum", yesNo(at(&D::DchisatAlbum), true, false)},
         {"Switches", "BorderPage", yesNo<I>(at(&D::GvulMuzag), 1, 0)},
         {"Switches", "FitPage", yesNo(at(&D::FitMuzag), true, false)},
         {"Switches", "ExtraTile", yesNo<I>(at(&D::TmunatPaar), 1, 0)},
