@@ -58,12 +58,15 @@ public:
         if (folderName != m_log.Hazmana && folderName != m_log.Hazmana + u'P')
             fault(u"the log is that of order \"%1\""_s.arg(m_log.Hazmana));
         checkTotals();
+        checkPaperLetters();
         checkSheet();
         for (const QString& name : namesWith(m_folder, ".jpp")) {
             if (!IsSheet(name))
                 checkPrintFile(name);
         }
         checkEveryItemIsThere();
+        if (m_report.prints == 0)
+            fault(u"no print file of the order can be read"_s);
         return m_report;
     }
 
@@ -77,6 +80,12 @@ private:
         if (m_log.countOfFailed && *m_log.countOfFailed != m_log.failed.size())
             fault(
                 u"the log counts %1 failed pictures and names %2"_s.arg(*m_log.countOfFailed).arg(m_log.failed.size()));
+    }
+
+    void checkPaperLetters() {
+        const auto isBlank = [](const QString& item) { return PrintCode::paperOf(item) == u' '; };
+        if (const auto blank = std::count_if(m_log.items.cbegin(), m_log.items.cend(), isBlank))
+            fault(u"%1 lines of the basket have no paper letter"_s.arg(blank));
     }
 
     // The sheet of an edited order may end in .jpg, instead of .jpp or besides it.

@@ -27,6 +27,8 @@ struct PrintCode {
     QString compose() const;
     // The copies of a basket line or print file's name; 0 when the first two characters are no number.
     static int copiesOf(const QString& line);
+    // The paper letter of a basket line or print file's name.
+    static QChar paperOf(const QString& line) { return line.size() < width ? QChar(u' ') : line[6]; }
     // The copies as two characters.
     static QString copiesField(int copies) { return LeftField(QString::number(copies), copiesWidth); }
 };

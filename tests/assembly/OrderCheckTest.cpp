@@ -67,6 +67,9 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
         {sheet, [](QByteArray& bytes) { bytes.truncate(bytes.size() / 2); }, 1, sheet},
         {log, [](QByteArray& bytes) { bytes.replace("fail_\",\"C:\\pics\\bad", "fail_\",\"C:\\pics\\bed"); }, 1,
          u"bad.jpg"_s},
+        // Its print file has another name then, and it lacks one.
+        {log, [](QByteArray& bytes) { bytes.replace("1 1015GNBC:\\pics\\two", "1 1015 NBC:\\pics\\two"); }, 3,
+         u"no paper letter"_s},
         // The total and the tails of both print files.
         {log, [](QByteArray& bytes) { bytes.replace("TotalPics\",15", "TotalPics\",16"); }, 3, two},
     };
@@ -75,9 +78,11 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
         EXPECT_EQ(found.size(), c.faults) << found.join(u'|').toStdString();
         EXPECT_TRUE(found.join(u'|').contains(c.about)) << found.join(u'|').toStdString();
     }
-    for (const auto& [gone, about] : {std::pair(two, u"two.jpg"_s), std::pair(log, u"no order log"_s)}) {
+    for (const auto& [gone, count, about] : {std::tuple(two, 1, u"two.jpg"_s),
+                                             {u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s, 3, u"no print file"_s},
+                                             {log, 1, u"no order log"_s}}) {
         ASSERT_TRUE(machine.files.removeFile(folder() / gone));
-        EXPECT_EQ(faults().size(), 1);
+        EXPECT_EQ(faults().size(), count);
         EXPECT_TRUE(faults().join(u'|').contains(about)) << faults().join(u'|').toStdString();
     }
 }
