@@ -210,18 +210,6 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
     }
 }
 
-TEST_F(PreparingAnEditedOrder, takesNoSecondPressWhileItPrepares) {
-    B3& page = open({edited(givePicture(u"one_1.jpg"_s)), edited(givePicture(u"two_2.jpg"_s))});
-    machine.pump.onPump = [&] {
-        page.Command5_Click();
-        page.Timer2_Tick();
-    };
-    page.Timer2_Tick();
-    machine.pump.onPump = {};
-    EXPECT_EQ(printFiles().size(), 2);
-    EXPECT_FALSE(machine.files.folderExists(folder(u"106"_s)));
-}
-
 TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     QStringList items;
     for (int i = 0; i < 8; ++i)

@@ -42,7 +42,7 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
         const QString third = givePicture(u"third.jpg"_s, 40, 30, Qt::blue);
         QByteArray cutShort = *encodeJpeg(noisyPicture(60, 60, 1), 90);
         cutShort.truncate(cutShort.size() / 2);
-        // What is copied as it is fails only where there is nothing to copy.
+        // What is copied as it is fails, as built in, only where there is nothing to copy.
         const QString nothing = u"C:\\pics\\nothing.jpg"_s;
         makeFolder(nothing);
         const QString second = deep == 1 ? nothing : giveFile(u"second.jpg"_s, cutShort);
@@ -61,6 +61,26 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
         EXPECT_TRUE(log.contains("\"-----------Total Failed\",\"1-----------\"\r\n"));
         EXPECT_TRUE(log.contains("\"More Comp = \"," + QByteArray::number(deep) + "\r\n"));
         EXPECT_EQ(front(), PageId::FtpFrm) << "one failed picture never stops an order";
+        chain.unload(PageId::FtpFrm);
+    }
+}
+
+TEST_F(PreparingAPlainOrder, carefullyDecodesWhatItCopiesAndPassesOverWarnings) {
+    state.DchisaAmoka = 1;
+    QByteArray spoilt = *encodeJpeg(noisyPicture(60, 60, 1), 90);
+    spoilt.replace(spoilt.size() / 2, 2, "\xFF\xD5"); // a marker where data is expected
+    const QStringList paths = {giveFile(u"spoilt.jpg"_s, spoilt),
+                               giveFile(u"cut_1.jpg"_s, spoilt.left(spoilt.size() / 2)),
+                               giveFile(u"words.jpg"_s, "no picture")};
+    EXPECT_FALSE(loadPicture(host(paths[0])));
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        state.MisparHazmana = careful ? u"202"_s : u"201"_s;
+        Form2& page = openWith({line(paths[0]), line(paths[1]), line(paths[2])});
+        const TextList& failed = page.controls().List4fail;
+        page.Command6_Click();
+        EXPECT_EQ(failed.items(), careful ? paths.mid(1) : QStringList());
+        EXPECT_EQ(unpacked(u"1 1015GNB0000_0173706F696C74.jpp"_s, state.MisparHazmana)->picture, spoilt);
         chain.unload(PageId::FtpFrm);
     }
 }
@@ -87,6 +107,14 @@ TEST_F(PreparingAPlainOrder, dropsWhatIsNoJpegInTwoWalksThatPassOverTheItemBehin
     EXPECT_EQ(left.items(), QStringList({other(4), jpg}));
     EXPECT_EQ(removed.count(), 4);
     EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0001_016131.jpp"_s));
+
+    for (const bool careful : {false, true}) {
+        chain.unload(PageId::FtpFrm);
+        state.Careful = careful;
+        state.MisparHazmana = careful ? u"202"_s : u"201"_s;
+        openWith({line(givePicture(u"b2.Jpg"_s)), line(givePicture(u"c3.jPG"_s)), jpg}).Command3_Click();
+        EXPECT_EQ(printFiles(state.MisparHazmana).size(), careful ? 3 : 1);
+    }
 }
 
 TEST_F(PreparingAPlainOrder, saysSoWhenNothingIsLeftAndTakesNoNumber) {
@@ -223,26 +251,6 @@ TEST_F(PreparingAnAlbum, drawsItsOwnSheetWithTheContactSheetBelow) {
         const QColor found = sheet->image().pixelColor(at);
         EXPECT_LE(std::abs(found.red() - wanted.red()), 8) << at.x();
         EXPECT_LE(std::abs(found.blue() - wanted.blue()), 8) << at.x();
-    }
-}
-
-TEST_F(PreparingAnAlbum, sizesItsPicturesToTheAlbumUnlessTheyAreCompressedDeeply) {
-    state.shemot.ppr = u"02/04"_s;
-    const QString source = givePicture(u"one.jpg"_s, 960, 640);
-    for (const int deep : {0, 1}) {
-        state.DchisaAmoka = static_cast<std::int16_t>(deep);
-        state.MisparHazmana = u"105"_s;
-        openWith({albumLine(source)}).Command6_Click();
-        const Result<PrintFileContent> print = unpacked(u"1 3060MNB0000_106F6E65.jpp"_s);
-        ASSERT_TRUE(print);
-        if (deep == 1) {
-            EXPECT_EQ(print->picture, *machine.files.read(DrivePath(source))) << "copied as it is";
-        } else {
-            EXPECT_EQ(QImage::fromData(print->picture).size(), QSize(480, 320));
-        }
-        EXPECT_EQ(print->tail, "1 1                     1  1051234      ") << "the customer's fields are empty";
-        std::filesystem::remove_all(host(folder()));
-        chain.unload(PageId::FtpFrm);
     }
 }
 

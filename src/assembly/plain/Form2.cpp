@@ -96,7 +96,7 @@ void Form2::choose(int index) {
 // The basket of an order that goes on has been through this.
 void Form2::keepOnlyJpeg() {
     if (!m_preparation.goesOn())
-        PlainPreparation::keepOnlyJpeg(List1, List4removed);
+        m_preparation.keepOnlyJpeg(List1, List4removed);
     showProgress();
     Q_EMIT changed();
 }

@@ -4,6 +4,7 @@
 #include "assembly/WorkAhead.h"
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
+#include "imaging/files/JpegCheck.h"
 #include "order/BasketLine.h"
 #include "order/OrderNames.h"
 #include "platform/Machine.h"
@@ -22,23 +23,27 @@ BasketLine split(const QString& line) {
     return BasketLine::split(line, LineForm::Short);
 }
 
-// Cameras write one of these two spellings; other files come with a folder that was added whole.
-bool isJpegItem(const QString& item) {
+// As built in, only these two spellings that cameras write pass.
+bool isJpegItem(const QString& item, bool careful) {
     const QString ending = item.right(3);
-    return ending == u"JPG" || ending == u"jpg";
+    return careful ? ending.compare(u"jpg", Qt::CaseInsensitive) == 0 : ending == u"JPG" || ending == u"jpg";
 }
 
 } // namespace
 
-// The prints of the order, scaled on other threads ahead of the step that packs them. That work takes a source path and
-// gives bytes; it shares no state with the page.
+// The prints of the order, scaled on other threads ahead of the step that packs them; with deep compression the file
+// itself, which as built in nobody looks into. That work takes a source path and gives bytes; it shares no state with
+// the page.
 class PlainPreparation::Prints {
 public:
     Prints(const SessionState& state, const Files& files, const QStringList& items, const QSet<int>& there)
         : m_files(files)
         , m_paper(PaperSize::ofText(state.shemot.ppr))
-        , m_sources(state.DchisaAmoka == 1 ? QList<DrivePath>() : sourcesToScale(items, there))
-        , m_prints(static_cast<int>(m_sources.size()), [this](int i) { return scaling(m_sources[i]); }) {}
+        , m_sources(sourcesToPrint(items, there))
+        , m_prints(static_cast<int>(m_sources.size()),
+                   [this, deep = state.DchisaAmoka == 1, careful = state.Careful](int i) {
+                       return deep ? copying(m_sources[i], careful) : scaling(m_sources[i]);
+                   }) {}
 
     template <class Waiting>
     Result<QByteArray> next(Waiting whileWaiting) {
@@ -48,7 +53,7 @@ public:
 private:
     using Ahead = WorkAhead<Result<QByteArray>>;
 
-    static QList<DrivePath> sourcesToScale(const QStringList& items, const QSet<int>& there) {
+    static QList<DrivePath> sourcesToPrint(const QStringList& items, const QSet<int>& there) {
         QList<DrivePath> sources;
         for (int i = 0; i < items.size(); ++i) {
             const BasketLine picture = split(items[i]);
@@ -67,15 +72,25 @@ private:
         };
     }
 
+    Ahead::Work copying(const DrivePath& path, bool decoded) const {
+        const Result<HostPath> source = m_files.host(path);
+        return [source, path, decoded, files = &m_files]() -> Result<QByteArray> {
+            if (!source)
+                return source.failure();
+            const Result<void> whole = decoded ? checkJpegDecodes(*source) : Result<void>();
+            return whole ? files->read(path) : whole.failure();
+        };
+    }
+
     const Files& m_files;
     const std::optional<PaperSize> m_paper;
     const QList<DrivePath> m_sources;
     Ahead m_prints;
 };
 
-void PlainPreparation::keepOnlyJpeg(TextList& lines, TextList& removed) {
+void PlainPreparation::keepOnlyJpeg(TextList& lines, TextList& removed) const {
     for (int i = 0; i < lines.count(); ++i) {
-        if (isJpegItem(lines.item(i)))
+        if (isJpegItem(lines.item(i), m_state.Careful))
             continue;
         removed.append(split(lines.item(i)).path.text());
         lines.removeAt(i);
@@ -140,10 +155,7 @@ void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& print
     m_events.inWork(line.path);
     if (isThere(index))
         return;
-    pack(packer, {index, line.code, line.path}, [&] {
-        return m_state.DchisaAmoka == 1 ? m_platform.files.read(line.path)
-                                        : prints.next([this] { m_platform.pump.pump(); });
-    });
+    pack(packer, {index, line.code, line.path}, [&] { return prints.next([this] { m_platform.pump.pump(); }); });
 }
 
 } // namespace lumora

@@ -12,8 +12,8 @@ public:
     using Preparation::Preparation;
 
     // Moves the lines that name no JPEG file to removed. A walk passes over the line behind a removed one, which the
-    // next walk reads.
-    static void keepOnlyJpeg(TextList& lines, TextList& removed);
+    // next walk reads. As built in, "Jpg" and the like are no such ending.
+    void keepOnlyJpeg(TextList& lines, TextList& removed) const;
 
     bool isAlbum() const;
     // No value when a click ended the program.
