@@ -19,6 +19,7 @@ QStringList FillPage(const QStringList& items, int& currentIndex, const std::fun
 void FolderPager::clear() {
     m_paths.clear();
     m_known.clear();
+    m_atEnd = false;
 }
 
 int FolderPager::addFolder(const DrivePath& folder, const QStringList& names) {
@@ -32,13 +33,16 @@ int FolderPager::addFolder(const DrivePath& folder, const QStringList& names) {
         m_known.insert(path);
     }
     const int added = m_paths.lastIndex() - lastBefore;
-    if (added > 0)
+    if (added > 0) {
         m_paths.setCurrentIndex(std::max(lastBefore, 0));
+        m_atEnd = false;
+    }
     return added;
 }
 
 QStringList FolderPager::FillPageList() {
     int index = m_paths.currentIndex();
+    m_atEnd = index + cellsOfPage >= m_paths.count();
     const QStringList page = FillPage(m_paths.items(), index, [](const QString& path) { return path; });
     m_paths.setCurrentIndex(index);
     return page;

@@ -25,6 +25,9 @@ public:
     bool isEmpty() const { return m_paths.isEmpty(); }
     QString item(int index) const { return m_paths.item(index); }
     int currentIndex() const { return m_paths.currentIndex(); }
+    void setCurrentIndex(int index) { m_paths.setCurrentIndex(index); }
+    // The page read last has the last picture.
+    bool isAtEnd() const { return m_atEnd; }
 
     void clear();
 
@@ -43,6 +46,7 @@ public:
 private:
     TextList m_paths;
     QSet<QString> m_known; // the list's items, so that adding a folder of thousands stays quick
+    bool m_atEnd = false;
 };
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #include "selection/PictureChoice.h"
 
+#include "order/EditRecord.h"
 #include "session/SessionState.h"
 
 #include <algorithm>
@@ -14,8 +15,9 @@ std::optional<QString> PictureChoice::recordOf(const QString& path) const {
 }
 
 PrintCode PictureChoice::code(int copies, PaperWords words) {
-    m_paper = paperLetter(m_order.maat, words, m_paper);
-    return {copies, sizeField(m_order), m_paper, m_order.Bord};
+    const OrderDetails& order = m_state.shemot;
+    m_paper = paperLetter(order.maat, words, m_paper);
+    return {copies, sizeField(order), m_paper, order.Bord};
 }
 
 void PictureChoice::put(const BasketLine& line) {
@@ -33,22 +35,40 @@ void PictureChoice::turnTo(const QStringList& paths) {
 }
 
 void PictureChoice::nextPage() {
+    if (!hasNextPage())
+        return;
+    m_seen.seen({SeenPages::Of::Folders, m_folders.currentIndex()});
     turnTo(m_folders.FillPageList());
 }
 
 void PictureChoice::previousPage() {
-    m_folders.PageBack();
-    nextPage();
+    const std::optional<SeenPages::Page> before = m_seen.goBack(m_basket.count());
+    if (!before) {
+        m_folders.PageBack();
+        turnTo(m_folders.FillPageList());
+    } else if (before->of == SeenPages::Of::Folders) {
+        m_folders.setCurrentIndex(before->start);
+        turnTo(m_folders.FillPageList());
+    } else {
+        m_basket.setCurrentIndex(before->start);
+        readChosenPage();
+    }
 }
 
 void PictureChoice::chosenPage() {
+    m_seen.seen({SeenPages::Of::Chosen, std::max(m_basket.currentIndex(), 0)});
+    readChosenPage();
+}
+
+void PictureChoice::readChosenPage() {
     // The reading position of a basket that was never paged is -1; its page begins with the first line.
-    int index = std::max(m_basket.currentIndex(), 0);
+    const int start = std::max(m_basket.currentIndex(), 0);
+    int index = start;
     const int column = BasketLine::pathColumn(m_basket.form());
     const QStringList paths = FillPage(m_basket.lines().items(), index, [column](const QString& line) {
         return line.trimmed().isEmpty() ? QString() : line.mid(column);
     });
-    m_basket.setCurrentIndex(index);
+    m_basket.setCurrentIndex(m_seen.behindChosenPage(start, index, m_basket.count()));
     turnTo(paths);
 }
 
@@ -63,30 +83,34 @@ void PictureChoice::markPage() {
 void PictureChoice::clear() {
     m_folders.clear();
     m_basket.clear();
+    m_seen.clear();
     turnTo({});
 }
 
 void PictureChoice::choose(int cell, const QString& record) {
-    const PrintCode now = code(std::max(copies(cell), 1), PaperWords::All);
-    m_copies[static_cast<std::size_t>(cell)] = now.copies;
-    put({now.compose(), record, DrivePath(path(cell))});
+    put({code(std::max(copies(cell), 1), PaperWords::All).compose(), record, DrivePath(path(cell))});
+    markPage();
 }
 
-void PictureChoice::setCopies(int cell, int copies, const QString& record) {
+void PictureChoice::setCopies(int cell, int copies) {
     copies = std::clamp(copies, 0, PrintCode::mostCopies);
-    m_copies[static_cast<std::size_t>(cell)] = copies;
     const int index = m_basket.FindByPath(path(cell));
     if (copies == 0)
         m_basket.removeAt(index);
     else if (index >= 0)
         m_basket.replaceAt(index, BasketLine::withCopies(m_basket.item(index), copies));
     else
-        put({code(copies, PaperWords::All).compose(), record, DrivePath(path(cell))});
+        put({code(copies, PaperWords::All).compose(), EditRecord::newPicture(), DrivePath(path(cell))});
+    markPage();
 }
 
 void PictureChoice::chooseAll() {
-    for (const QString& path : m_folders.paths().items())
-        put({code(1, PaperWords::WholeFolder).compose(), {}, DrivePath(path)});
+    for (const QString& path : m_folders.paths().items()) {
+        const int index = m_state.Careful ? m_basket.FindByPath(path) : -1;
+        const int copies = index < 0 ? 1 : PrintCode::copiesOf(m_basket.item(index));
+        const PaperWords words = m_state.Careful ? PaperWords::All : PaperWords::WholeFolder;
+        put({code(copies, words).compose(), {}, DrivePath(path)});
+    }
 }
 
 int PictureChoice::storeRecord(const QString& path, const QString& record) {

@@ -3,19 +3,23 @@
 #include "common/DrivePath.h"
 #include "selection/Basket.h"
 #include "selection/FolderPager.h"
+#include "selection/SeenPages.h"
 
 #include <array>
 #include <optional>
 
 namespace lumora {
 
+struct SessionState;
+
 // What the customer chooses from and what is chosen: the folders picked so far, the twelve cells of the page in view
 // with the copies of each, and the basket. The paper, the size and the border of a line are those that the order has
 // when the line is written.
 class PictureChoice {
 public:
-    explicit PictureChoice(const OrderDetails& order)
-        : m_order(order) {}
+    explicit PictureChoice(const SessionState& state)
+        : m_state(state)
+        , m_seen(state) {}
     // Once, before any picture is chosen.
     void setForm(LineForm form) { m_basket.setForm(form); }
 
@@ -25,7 +29,7 @@ public:
     const TextList& page() const { return m_page; }
     // Empty for a cell without a picture.
     QString path(int cell) const { return m_page.item(cell); }
-    // The number that the cell shows, 0 to 99. Two cells with the same picture count separately.
+    // The number that the cell shows, 0 to 99: the copies of its picture, the same in each cell that shows it.
     int copies(int cell) const { return m_copies.at(static_cast<std::size_t>(cell)); }
     bool chosen(int cell) const { return copies(cell) > 0; }
     bool inBasket(const QString& path) const { return m_basket.FindByPath(path) >= 0; }
@@ -33,6 +37,8 @@ public:
     std::optional<QString> recordOf(const QString& path) const;
 
     int addFolder(const DrivePath& folder, const QStringList& names) { return m_folders.addFolder(folder, names); }
+    // False when the page behind the last one is asked for and there is none.
+    bool hasNextPage() const { return m_seen.hasNext(m_folders); }
     void nextPage();
     void previousPage();
     // A page of the basket's own pictures, from its reading position on.
@@ -44,9 +50,10 @@ public:
 
     // A picture that is chosen already keeps its copies and its place in the basket. record is empty in the short form.
     void choose(int cell, const QString& record);
-    // The rest of a line stays, its record too; record is for a line that is added. 0 copies remove the line.
-    void setCopies(int cell, int copies, const QString& record);
-    // One copy of every picture of the folders.
+    // The rest of a line stays, its record too; a line that is added has the record of a new picture. 0 copies remove
+    // the line.
+    void setCopies(int cell, int copies);
+    // Every picture of the folders. As built in, each has one copy then, and the English words give no paper letter.
     void chooseAll();
     // The index of the line that has the record now, or -1 when the picture is not chosen.
     int storeRecord(const QString& path, const QString& record);
@@ -55,11 +62,13 @@ public:
 private:
     PrintCode code(int copies, PaperWords words);
     void put(const BasketLine& line);
+    void readChosenPage();
     void turnTo(const QStringList& paths);
 
-    const OrderDetails& m_order;
+    const SessionState& m_state;
     Basket m_basket;
     FolderPager m_folders;
+    SeenPages m_seen;
     TextList m_page;
     std::array<int, cellsOfPage> m_copies{};
     QChar m_paper = u' '; // the letter of the line before, for a paper word that is not known

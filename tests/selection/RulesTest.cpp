@@ -109,17 +109,6 @@ TEST(AFolderPager, doublesAnOrdinaryFolderButNoDriveRoot) {
     EXPECT_EQ(pager.item(9), u"E:\\01.jpg"_s);
 }
 
-TEST(AFolderPager, goesBackByThePageInViewAndTheOneBefore) {
-    for (const auto& [pages, firstAfterBack] : {std::pair{1, 1}, {2, 1}, {3, 13}, {4, 25}}) {
-        FolderPager pager;
-        pager.addFolder(u"C:\\p"_path, names(60));
-        for (int i = 0; i < pages; ++i)
-            pager.FillPageList();
-        pager.PageBack();
-        EXPECT_EQ(pager.FillPageList().first(), u"C:\\p\\%1.jpg"_s.arg(firstAfterBack, 2, 10, QLatin1Char('0')));
-    }
-}
-
 // Fourteen pictures, the first twelve of them in the cells.
 struct Choosing {
     explicit Choosing(LineForm form = LineForm::Short) {
@@ -132,64 +121,94 @@ struct Choosing {
     }
     QStringList lines() const { return choice.basket().lines().items(); }
 
-    OrderDetails order;
-    PictureChoice choice{order};
+    SessionState state;
+    OrderDetails& order = state.shemot;
+    PictureChoice choice{state};
 };
 
 TEST(AChoice, keepsCopiesAndPlaceOfAPictureThatIsChosenAgain) {
     Choosing at;
     at.choice.choose(2, {});
     at.choice.choose(0, {});
-    at.choice.setCopies(2, 12, {});
+    at.choice.setCopies(2, 12);
     at.order.ppr = u"13/18"_s;
     EXPECT_EQ(at.lines(), QStringList({u"121015GNBC:\\p\\03.jpg"_s, u"1 1015GNBC:\\p\\01.jpg"_s}));
     at.choice.choose(2, {});
     EXPECT_EQ(at.lines().first(), u"121318GNBC:\\p\\03.jpg"_s);
-    at.choice.setCopies(2, 100, {});
+    at.choice.setCopies(2, 100);
     EXPECT_EQ(at.lines().first(), u"991318GNBC:\\p\\03.jpg"_s);
-    at.choice.setCopies(2, 0, {});
+    at.choice.setCopies(2, 0);
     EXPECT_EQ(at.lines(), QStringList(u"1 1015GNBC:\\p\\01.jpg"_s));
     at.choice.choose(2, {});
     EXPECT_EQ(at.choice.copies(2), 1);
 }
 
-TEST(AChoice, isMarkedOnEachPageThatHasItsPictures) {
-    Choosing at;
-    at.choice.choose(1, {});
-    at.choice.setCopies(1, 2, {});
-    at.choice.nextPage();
-    EXPECT_FALSE(at.choice.chosen(1));
-    at.choice.choose(0, {});
-    at.choice.previousPage();
-    EXPECT_EQ(at.choice.copies(1), 2);
-    EXPECT_FALSE(at.choice.chosen(0));
-    at.choice.chosenPage();
-    EXPECT_EQ(at.choice.page().items(), QStringList({u"C:\\p\\02.jpg"_s, u"C:\\p\\13.jpg"_s}));
-    EXPECT_EQ(at.choice.copies(0), 2);
-}
-
-TEST(AChoice, countsEachOfTwoCellsWithTheSamePictureByItself) {
-    Choosing at;
+TEST(AChoice, ofAPictureThatStandsInTwoCellsIsOneChoice) {
+    Choosing at(LineForm::Full);
     at.choice.clear();
     for (int i = 0; i < 2; ++i)
         at.choice.addFolder(u"C:\\q"_path, names(1));
     at.choice.nextPage();
-    at.choice.choose(0, {});
-    at.choice.setCopies(0, 5, {});
-    at.choice.choose(1, {});
-    EXPECT_EQ(at.lines(), QStringList(u"1 1015GNBC:\\q\\01.jpg"_s)) << "the count of the cell that was pressed last";
-    EXPECT_EQ(at.choice.copies(0), 5);
+    at.choice.choose(0, QString(EditRecord::newPicture()).replace(15, 3, u"130"_s));
+    at.choice.setCopies(0, 5);
+    EXPECT_EQ(at.choice.copies(1), 5);
+    at.choice.setCopies(1, 0);
+    EXPECT_TRUE(at.lines().isEmpty() && !at.choice.chosen(0));
+    at.choice.setCopies(1, 2);
+    EXPECT_EQ(at.lines(), QStringList(u"2 1015GNB"_s + EditRecord::newPicture() + u"C:\\q\\01.jpg"_s));
+    EXPECT_TRUE(at.choice.chosen(0));
 }
 
-TEST(AChoice, ofTheWholeFolderIsOneCopyOfEachWithTheLetterBeforeForAWordItDoesNotKnow) {
-    Choosing at;
-    at.choice.choose(3, {});
-    at.choice.setCopies(3, 7, {});
-    at.order.maat = u"Matte"_s;
-    at.choice.chooseAll();
-    EXPECT_EQ(at.lines().size(), 14);
-    EXPECT_EQ(at.choice.basket().SumCopies(), 14);
-    EXPECT_EQ(at.lines().first(), u"1 1015GNBC:\\p\\04.jpg"_s);
+TEST(AChoice, ofTheWholeFolderKeepsCopiesAndKnowsTheEnglishWordsCarefully) {
+    struct Case {
+        bool careful;
+        int copies;
+        QString first, last;
+    };
+    for (const Case& c : {Case{false, 14, u"1 1015GNBC:\\p\\04.jpg"_s, u"1 1015GNBC:\\p\\14.jpg"_s},
+                          Case{true, 20, u"7 1015MNBC:\\p\\04.jpg"_s, u"1 1015MNBC:\\p\\14.jpg"_s}}) {
+        Choosing at;
+        at.state.Careful = c.careful;
+        at.choice.choose(3, {});
+        at.choice.setCopies(3, 7);
+        at.order.maat = u"Matte"_s;
+        at.choice.chooseAll();
+        EXPECT_EQ(at.lines().size(), 14);
+        EXPECT_EQ(at.choice.basket().SumCopies(), c.copies);
+        EXPECT_EQ(at.lines().first() + at.lines().last(), c.first + c.last) << "built in the letter before";
+    }
+}
+
+// n next, p previous, c the chosen alone; then the first picture and the number of pictures of the page.
+TEST(AChoice, showsThePagesThatWereSeen) {
+    const struct {
+        bool careful;
+        const char* presses;
+        QString first;
+        int count;
+    } cases[] = {{false, "nnn", u"40"_s, 1},  {true, "nnn", u"37"_s, 4},   {false, "nnp", u"16"_s, 12},
+                 {true, "nnp", u"25"_s, 12},  {true, "nnpp", u"13"_s, 12}, {true, "pp", u"01"_s, 12},
+                 {false, "ccc", u"14"_s, 1},  {true, "cc", u"13"_s, 2},    {true, "ccc", u"01"_s, 12},
+                 {true, "cccp", u"13"_s, 12}, {true, "ccp", u"01"_s, 12},  {true, "ncp", u"25"_s, 12},
+                 {true, "cnp", u"01"_s, 12}};
+    for (const auto& c : cases) {
+        Choosing at;
+        at.state.Careful = c.careful;
+        at.choice.clear();
+        at.choice.addFolder(u"C:\\p"_path, names(40));
+        at.choice.nextPage();
+        for (int page = 0; page < 2; ++page) {
+            for (int cell = 0; cell < (page == 0 ? 12 : 2); ++cell)
+                at.choice.choose(cell, {});
+            at.choice.nextPage();
+        }
+        at.choice.previousPage();
+        for (const char press : std::string_view(c.presses))
+            press == 'n' ? at.choice.nextPage() : press == 'p' ? at.choice.previousPage() : at.choice.chosenPage();
+        EXPECT_EQ(at.choice.path(0), u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
+        EXPECT_EQ(at.choice.page().count(), c.count) << c.careful << c.presses;
+        EXPECT_EQ(at.choice.hasNextPage(), !c.careful || at.choice.path(c.count - 1) != u"C:\\p\\40.jpg"_s);
+    }
 }
 
 TEST(AChoice, carriesTheRecordOfAPictureWhateverPageIsInView) {
@@ -198,7 +217,7 @@ TEST(AChoice, carriesTheRecordOfAPictureWhateverPageIsInView) {
     EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), -1);
     at.choice.choose(4, EditRecord::newPicture());
     at.choice.choose(0, EditRecord::newPicture());
-    at.choice.setCopies(0, 2, {});
+    at.choice.setCopies(0, 2);
     at.choice.nextPage();
     EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), 1);
     EXPECT_EQ(at.lines().last(), u"2 1015GNB"_s + edited + u"C:\\p\\01.jpg"_s);
@@ -240,12 +259,6 @@ TEST(AFinish, compressesLargePrintsAsThePolicySays) {
         EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 1), c.asking) << c.paper;
         EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 2), c.always) << c.paper;
     }
-    EXPECT_EQ(addressBoxOf(OrderKind::EditedPrint, false), AddressBox::Mail);
-    EXPECT_EQ(addressBoxOf(OrderKind::Album, false), AddressBox::AlbumMail);
-    EXPECT_EQ(addressBoxOf(OrderKind::Album, true), AddressBox::None);
-    EXPECT_EQ(checkCoupon(220, 221), CouponFit::TooMany);
-    EXPECT_EQ(checkCoupon(220, 219), CouponFit::TooFew);
-    EXPECT_EQ(checkCoupon(220, 220), CouponFit::Matches);
 }
 
 } // namespace

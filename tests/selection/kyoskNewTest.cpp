@@ -100,11 +100,18 @@ TEST_F(ThePictures, areShownTwelveAtATimeAndStayWhenTheDialogIsCancelled) {
 
 TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesOnly) {
     kyoskNew& page = openWith(2);
-    pick(page, u"C:\\?\\01.jpg"_s);
-    EXPECT_EQ(machine.dialogs.messages,
-              QStringList(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s));
-    EXPECT_EQ(page.controls().List4.count(), 2);
-    EXPECT_TRUE(page.controls().Picture1[0].visible);
+    int refused = 0;
+    for (const auto& [careful, picture, taken] : {std::tuple(false, u"C:\\?\\01.jpg"_s, false),
+                                                  {false, u"C:\\p\\caf?.jpg"_s, false},
+                                                  {true, u"C:\\?\\01.jpg"_s, false},
+                                                  {true, u"C:\\p\\caf?.jpg"_s, true}}) {
+        state.Careful = careful;
+        pick(page, picture);
+        EXPECT_EQ(page.controls().List4.count(), taken ? 4 : 2) << "picked again";
+        EXPECT_EQ(machine.dialogs.messages.size(), refused += taken ? 0 : 1);
+        EXPECT_TRUE(page.controls().Picture1[0].visible);
+    }
+    EXPECT_EQ(machine.dialogs.messages.last(), u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
 }
 
 TEST_F(ThePictures, leaveACellEmptyForAFileThatCannotBeRead) {
@@ -219,12 +226,15 @@ TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
     page.Command24_Click();
     EXPECT_TRUE(!page.controls().Image13.visible && page.controls().Image7.visible)
         << "there is always a way to finish";
-    page.Image7_Click();
+    for (const bool deep : {false, true}) {
+        state.DchisatAlbum = deep;
+        page.Image7_Click();
+        EXPECT_EQ(state.DchisaAmoka, deep ? 1 : 0);
+    }
     page.Txt4Ml2_Change(u"other@example.com"_s);
     page.Command8_Click();
     EXPECT_EQ(chain.front()->id(), PageId::Form2);
     EXPECT_EQ(state.shemot.Mail, u"other@example.com"_s);
-    EXPECT_EQ(state.DchisaAmoka, 1);
     EXPECT_TRUE(state.handOver.pressStart);
     EXPECT_EQ(state.handOver.lines.value(0), u"1 3060MNB"_s + first);
 }

@@ -19,7 +19,7 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
-    , m_choice(state.shemot)
+    , m_choice(state)
     , File1(platform.files, u"*.jpg"_s)
     , Timer1(40, [this] { moveLabel35(); })
     , Timer2(500, [this] { movePointers(); }) {}
@@ -75,6 +75,7 @@ void kyoskNew::showChoice() {
     List2 = m_choice.page();
     List4 = m_choice.folders().paths();
     Label7.text = QString::number(m_choice.basket().SumCopies());
+    Image16.enabled = m_choice.hasNextPage();
     for (int cell = 0; cell < cellsOfPage; ++cell) {
         const auto at = static_cast<std::size_t>(cell);
         const QString path = m_choice.path(cell);

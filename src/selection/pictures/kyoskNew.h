@@ -147,6 +147,7 @@ private:
     void takeIntoEditor(const QString& path);
     void addCopies(int cell, int more);
     void setCopies(int cell, int copies);
+    void beginWithoutEdits(const DrivePath& picture);
     void cancelPage();
     void chooseWholeFolder();
     void chooseByHand();

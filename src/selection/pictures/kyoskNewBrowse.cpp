@@ -80,7 +80,8 @@ void kyoskNew::pickFolder() {
     Pic4Brose.visible = false;
     Q_EMIT changed();
 
-    if (plain() && HasQuestionMark(picture.text())) {
+    // A picture whose own name is outside the code page fails alone, when the order is prepared.
+    if (plain() && HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text())) {
         m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
         return;
     }

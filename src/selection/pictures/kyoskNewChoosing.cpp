@@ -72,14 +72,23 @@ void kyoskNew::addCopies(int cell, int more) {
 void kyoskNew::setCopies(int cell, int copies) {
     const QString path = m_choice.path(cell);
     const bool wasInBasket = m_choice.inBasket(path);
-    m_choice.setCopies(cell, copies, m_state.edit.EditState);
+    m_choice.setCopies(cell, copies);
+    if (!plain() && !wasInBasket && m_choice.inBasket(path))
+        beginWithoutEdits(DrivePath(path));
     if (!m_choice.chosen(cell)) {
-        if (m_openCell == cell)
+        if (m_choice.path(m_openCell) == path)
             m_openCell = -1;
         if (!plain() && wasInBasket)
             repaint(path); // as its file is, since a picture chosen again begins without edits
     }
     showChoice();
+}
+
+// What the editor still holds of the picture goes too, so that leaving the editor does not store it.
+void kyoskNew::beginWithoutEdits(const DrivePath& picture) {
+    StoredSmallView::discard(m_state, m_platform.files, picture);
+    if (m_state.edit.PicturePath == picture)
+        UnpackEditState(EditRecord::newPicture(), m_state.edit);
 }
 
 void kyoskNew::cancelPage() {
