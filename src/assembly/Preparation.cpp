@@ -1,6 +1,7 @@
 #include "assembly/Preparation.h"
 
 #include "assembly/edited/KeptWork.h"
+#include "common/FixedText.h"
 #include "order/BasketLine.h"
 #include "order/PrintCode.h"
 #include "order/PrintFileName.h"
@@ -25,7 +26,11 @@ void Preparation::count(const QStringList& lines) {
 void Preparation::begin(const QStringList& lines) {
     m_lines = lines;
     m_failed.clear();
+    m_prints = 0;
+    m_withoutPrints = false;
     m_writeFailures = 0;
+    m_state.transfer.leftOut.clear();
+    m_state.transfer.leftOutAsked = false;
     m_state.transfer.MailFlag = 0;
     count(m_lines);
 }
@@ -123,17 +128,36 @@ bool Preparation::forEachPicture(const std::function<void(int)>& step) {
 
 bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
                        const std::function<Result<QByteArray>()>& picture) {
+    const int failuresBefore = m_writeFailures;
     const PrintPacker::Outcome outcome = packer.pack(line, picture);
-    if (!outcome.packed)
-        notPrepared(line.path);
+    if (outcome.packed)
+        ++m_prints;
+    else if (outcome.writeFailure || m_writeFailures > failuresBefore)
+        notPrepared(line.path, LeftOut::Why::NotWritten);
+    else
+        notPrepared(line.path, HasQuestionMark(line.path.text())        ? LeftOut::Why::Name
+                               : m_platform.files.fileExists(line.path) ? LeftOut::Why::Damaged
+                                                                        : LeftOut::Why::Gone);
     if (outcome.writeFailure)
         notWritten(*outcome.writeFailure);
     return outcome.packed;
 }
 
-void Preparation::notPrepared(const DrivePath& picture) {
+void Preparation::notPrepared(const DrivePath& picture, LeftOut::Why why) {
     m_failed += picture.text();
+    m_state.transfer.leftOut += LeftOut{picture, why};
     m_events.notPrepared(picture);
+}
+
+bool Preparation::isHeldBackForPrints() {
+    m_withoutPrints = m_state.Careful && m_prints == 0 && m_there.isEmpty();
+    return m_withoutPrints;
+}
+
+bool Preparation::isHeldBackForSheet(const Failure& failure) {
+    if (m_state.Careful)
+        m_events.notWritten(PreparationEvents::NotWritten::Sheet, failure);
+    return m_state.Careful;
 }
 
 // On a full disk every picture fails in the same way.
@@ -154,7 +178,7 @@ std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& 
     });
     if (!goOn)
         return std::nullopt;
-    m_events.sheetDrawn(sheet.bitmap());
+    m_sheetSaved = m_events.sheetDrawn(sheet.bitmap());
     return sheet.bitmap();
 }
 

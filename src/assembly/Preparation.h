@@ -5,6 +5,7 @@
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
+#include "session/SessionState.h"
 
 #include <QSet>
 #include <QStringList>
@@ -16,12 +17,11 @@
 namespace lumora {
 
 struct Platform;
-struct SessionState;
 
 // What the preparation of an order tells its page.
 class PreparationEvents {
 public:
-    enum class NotWritten { Folder, File, Counter, Log };
+    enum class NotWritten { Folder, File, Sheet, Counter, Log };
 
     // position: of the picture in work, from 1.
     virtual void packing(int position) = 0;
@@ -34,7 +34,8 @@ public:
     // Of several File failures only the first; filesNotWritten() tells their number at the end.
     virtual void notWritten(NotWritten what, const Failure& failure) = 0;
     virtual void filesNotWritten(int count) = 0;
-    virtual void sheetDrawn(const Bitmap& sheet) = 0;
+    // False where the page saves the sheet and could not.
+    virtual bool sheetDrawn(const Bitmap& sheet) = 0;
     // Processes paint and input events. False when a click ended the program.
     virtual bool yield() = 0;
 
@@ -56,6 +57,8 @@ public:
     bool goesOn() const { return m_goesOn; }
     // Sets TotalPics, the sum of the copies.
     void count(const QStringList& lines);
+    // The preparation has ended without a print file, and the order does not go on.
+    bool endedWithoutPrints() const { return m_withoutPrints; }
 
 protected:
     void begin(const QStringList& lines);
@@ -69,7 +72,10 @@ protected:
     // True for a line whose print the order has from before.
     bool isThere(int index) const { return m_there.contains(index); }
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
-    void notPrepared(const DrivePath& picture);
+    void notPrepared(const DrivePath& picture, LeftOut::Why why);
+    // The order is held back: it has no print file, or no sheet. As built in, it goes on.
+    bool isHeldBackForPrints();
+    bool isHeldBackForSheet(const Failure& failure);
     void notWritten(const Failure& failure);
     // Tells of what is kept for going on with the order: it can be sent without.
     void keep(const Result<void>& written);
@@ -87,6 +93,7 @@ protected:
     QStringList m_lines;
     std::optional<OrderFolder> m_folder; // set by claimFolder()
     QSet<int> m_there;                   // indices of the lines whose print is there
+    bool m_sheetSaved = true;            // or the page does not save it
 
 private:
     Result<void> readyFolder(OrderFolder::Ending ending);
@@ -96,6 +103,8 @@ private:
 
     std::optional<OrderJournal> m_journal; // of m_folder
     QStringList m_failed;                  // paths of the pictures that could not be prepared
+    int m_prints = 0;                      // print files that this preparation has made
+    bool m_withoutPrints = false;
     int m_writeFailures = 0;
     bool m_goesOn = false;
     DrivePath m_replaced; // folder of the order that this one is prepared again from, or empty

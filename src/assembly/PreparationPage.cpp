@@ -12,11 +12,13 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain)
+PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain,
+                                 LeftOutControls& shown)
     : Page(id)
     , m_state(state)
     , m_platform(platform)
-    , m_chain(chain) {}
+    , m_chain(chain)
+    , m_leftOut(id, state, platform, chain, shown) {}
 
 bool PreparationPage::takeLines() {
     shared().List1.append(std::exchange(m_state.handOver.lines, {}));
@@ -70,13 +72,21 @@ void PreparationPage::notPrepared(const DrivePath& picture) {
     Q_EMIT changed();
 }
 
-void PreparationPage::sheetDrawn(const Bitmap& sheet) {
+bool PreparationPage::sheetDrawn(const Bitmap& sheet) {
     shared().Picture5Image = sheet;
     shared().Picture5.visible = true;
+    return true;
 }
 
 void PreparationPage::handOver(Outcome toSender) {
     const Outcome prepared = m_state.TachanaMekomit ? Outcome::KeptAtStation : toSender;
+    const bool staysHere = prepared == Outcome::KeptAtStation || prepared == Outcome::PreparedForLater;
+    if (staysHere && m_leftOut.isDue()) {
+        m_toSender = toSender;
+        m_leftOut.open();
+        Q_EMIT changed();
+        return;
+    }
     m_handedOver = true;
     m_state.transfer.SugMishloah = Sending::NewOrder;
     const bool goesOn = m_chain.canFollow(id(), prepared);
@@ -88,8 +98,26 @@ void PreparationPage::handOver(Outcome toSender) {
         m_state.handOver.notice =
             m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
                 .arg(m_state.MisparHazmana);
+    if (prepared == Outcome::KeptAtStation && !m_state.transfer.leftOut.isEmpty())
+        m_state.handOver.notice += u' ' + leftOutText(m_state);
     if (!m_chain.follow(id(), prepared))
         m_chain.unload(id());
+}
+
+void PreparationPage::askWithoutPrints() {
+    m_leftOut.open(LeftOutBox::Order::WithoutPrints);
+    Q_EMIT changed();
+}
+
+void PreparationPage::goOnWithout() {
+    if (!m_leftOut.isOpen() || !shared().leftOut.Command4Bli.visible)
+        return;
+    m_leftOut.goOnWithout();
+    handOver(m_toSender);
+}
+
+void PreparationPage::goBack() {
+    m_leftOut.goBack();
 }
 
 void PreparationPage::leaveProgram() {

@@ -2,6 +2,7 @@
 
 #include "assembly/Preparation.h"
 #include "imaging/Bitmap.h"
+#include "order/LeftOutBox.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/PageFlow.h"
@@ -25,6 +26,7 @@ struct PreparationControls : Controls {
     Caption Label4fail{*this, u"Label4fail"};         // how many could not be prepared; hidden when all could
     Caption Picture5{*this, u"Picture5", Caption::At::Hidden}; // the order sheet's box
     Bitmap Picture5Image;
+    LeftOutControls leftOut{*this};
 };
 
 // What the two pages share that turn a basket into an order folder (Form2, B3): the list with its progress, the words
@@ -32,6 +34,10 @@ struct PreparationControls : Controls {
 class PreparationPage : public Page, protected PreparationEvents {
     Q_OBJECT
 public:
+    // Events of the box of left out pictures.
+    void Command4Bli_Click() { goOnWithout(); }
+    void Command4Hazor_Click() { goBack(); }
+
     // State
     const PreparationControls& controls() const override = 0;
     bool isPreparing() const { return m_preparing; }
@@ -45,7 +51,8 @@ public:
     bool isSheetShown() const { return controls().Picture5.visible && !controls().Picture5Image.isNull(); }
 
 protected:
-    PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain);
+    // shown: of the page's own controls, which are made later.
+    PreparationPage(PageId id, SessionState& state, const Platform& platform, PageChain& chain, LeftOutControls& shown);
 
     virtual PreparationControls& shared() = 0;
 
@@ -74,12 +81,16 @@ protected:
     void notPrepared(const DrivePath& picture) override;
     void notWritten(NotWritten what, const Failure& failure) override;
     void filesNotWritten(int count) override;
-    void sheetDrawn(const Bitmap& sheet) override;
+    bool sheetDrawn(const Bitmap& sheet) override;
     bool yield() override;
 
-    // The order is complete: follows the page flow to the sender. A local station keeps its orders.
+    // The order is complete: follows the page flow to the sender, which asks about pictures that were left out. A local
+    // station keeps its orders; there and on the way to the finished orders the question is asked here.
     void handOver(Outcome toSender);
-    bool handedOver() const { return m_handedOver; }
+    // True once the page has done its work, or waits for the answer.
+    bool handedOver() const { return m_handedOver || m_leftOut.isOpen(); }
+    // Asks what to do without any print.
+    void askWithoutPrints();
     void leaveProgram();
 
     void tell(const QString& hebrew, const QString& english, const QString& reason = {});
@@ -89,6 +100,11 @@ protected:
     PageChain& m_chain;
 
 private:
+    void goOnWithout();
+    void goBack();
+
+    LeftOutBox m_leftOut;
+    Outcome m_toSender = Outcome::PreparedForFtp;
     Stage m_stage = Stage::Waiting;
     int m_position = 0;
     int m_count = 0;

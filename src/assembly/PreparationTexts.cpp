@@ -35,6 +35,11 @@ void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
     case NotWritten::File:
         return tell(u"קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."_s,
                     u"A file of the order could not be written. What was prepared so far is kept."_s, failure.message);
+    case NotWritten::Sheet:
+        return tell(u"לא ניתן לכתוב את דף ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
+                    u"The order sheet can't be written, so the order was not sent. What was prepared is kept. "
+                    u"Put it right, then try again."_s,
+                    failure.message);
     case NotWritten::Counter:
         return tell(u"מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."_s,
                     u"The number of the next order could not be stored. This order goes on."_s, failure.message);
@@ -85,6 +90,7 @@ void PreparationPage::showProgress() {
     }
     if (m_stage == Stage::Sheet || m_stage == Stage::Pictures)
         on.Label4Progress.text = on.Label4Progress.text.arg(position, count);
+    m_leftOut.show();
     on.Label4fail.visible = !on.List4fail.isEmpty();
     on.Label4fail.text = m_state.wording(u"%1 תמונות לא ניתן היה להכין:", u"Pictures that could not be prepared: %1")
                              .arg(on.List4fail.count());

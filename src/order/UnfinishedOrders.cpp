@@ -4,6 +4,7 @@
 #include "order/BasketLine.h"
 #include "order/EditRecord.h"
 #include "order/FinishedOrder.h"
+#include "order/LeftOutBox.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
@@ -53,6 +54,13 @@ bool hasFailed(const Files& files, const OrderFolder& folder) {
     return !bytes || !log.failed.isEmpty();
 }
 
+QStringList failedOf(const Files& files, const OrderFolder& folder) {
+    OrderLog log;
+    if (const Result<QByteArray> bytes = files.read(folder.logPath()))
+        log.read(*bytes);
+    return log.failed;
+}
+
 bool canBeSent(const SessionState& session, const OrderState& state) {
     return (state.way == Way::Ftp && SenderSetUp(session.profile, Sender::Ftp)) ||
            (state.way == Way::Http && SenderSetUp(session.profile, Sender::Http));
@@ -100,6 +108,8 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
     state.transfer.HazmanaP = inPieces ? 1 : 0;
     state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
     state.transfer.SugMishloah = Sending::NewOrder;
+    state.transfer.leftOut = leftOutOf(failedOf(files, order.folder));
+    state.transfer.leftOutAsked = order.state.phase != Phase::Prepared;
     if (order.state.choices.isEmpty())
         ReadReportDetails(files, order.folder.logPath(), state.shemot);
 }

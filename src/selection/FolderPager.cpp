@@ -40,6 +40,13 @@ int FolderPager::addFolder(const DrivePath& folder, const QStringList& names) {
     return added;
 }
 
+void FolderPager::takeBack(const QStringList& paths) {
+    clear();
+    m_paths.append(paths);
+    m_known = QSet<QString>(paths.begin(), paths.end());
+    m_paths.setCurrentIndex(0);
+}
+
 QStringList FolderPager::FillPageList() {
     int index = m_paths.currentIndex();
     m_atEnd = index + cellsOfPage >= m_paths.count();

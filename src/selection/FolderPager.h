@@ -36,6 +36,9 @@ public:
     // the list grew, the reading position becomes the last of the old items, or the first picture.
     int addFolder(const DrivePath& folder, const QStringList& names);
 
+    // All paths at once, from the first one on.
+    void takeBack(const QStringList& paths);
+
     bool IsInFolderList(const QString& path) const { return m_known.contains(path); }
 
     // The next page.

@@ -80,6 +80,13 @@ void PictureChoice::markPage() {
     }
 }
 
+void PictureChoice::takeBack(const QStringList& basket, const QStringList& pictures) {
+    clear();
+    m_folders.takeBack(pictures);
+    for (const QString& line : basket)
+        m_basket.append(line);
+}
+
 void PictureChoice::clear() {
     m_folders.clear();
     m_basket.clear();

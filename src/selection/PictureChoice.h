@@ -45,6 +45,8 @@ public:
     void chosenPage();
     // The copies of the cells are read from the basket again.
     void markPage();
+    // Takes what was chosen before, and the pictures that it was chosen from.
+    void takeBack(const QStringList& basket, const QStringList& pictures);
     // No folder, no page and nothing chosen.
     void clear();
 

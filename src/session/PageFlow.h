@@ -11,7 +11,7 @@ namespace lumora {
 enum class Outcome {
     OrderBegun,     // the customer begins an order
     SendingWanted,  // the sending page is asked for, with no order
-    PicturesWanted, // kind and details are known
+    PicturesWanted, // kind and details are known, or a prepared order goes back to its pictures
     FinishedWanted, // an earlier order is wanted
     NoticeWanted,   // the notice is read, and the customer comes back
     NoticeAlone,    // the notice is all that the tile has

@@ -210,22 +210,34 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
     }
 }
 
-TEST_F(PreparingAnEditedOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
-    QStringList items;
-    for (int i = 0; i < 8; ++i)
-        items += edited(givePicture(u"picture%1.jpg"_s.arg(i)), record(toned));
-    leaveAtTheThird(open(items), &B3::Timer2_Tick, &B3::Command2_Click);
-    for (const auto& entry : std::filesystem::directory_iterator(host(u"C:\\2000lumora"_s)))
-        EXPECT_TRUE(entry.is_directory() || entry.path().filename() == "bw.bmp") << entry.path();
-}
-
-TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLog) {
-    B3& page = open({edited(givePicture(u"one_1.jpg"_s))});
-    onceClaimed([&] { makeFolder(logPath()); });
-    page.Timer2_Tick();
-    EXPECT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_EQ(front(), PageId::B3);
-    EXPECT_EQ(printFiles().size(), 1);
+TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLogAndCarefullyNotWithoutSheetOrPrints) {
+    const QString good = edited(givePicture(u"one_1.jpg"_s)), bad = edited(giveFile(u"bad_1.jpg"_s, "no picture"));
+    const struct {
+        bool careful;
+        DrivePath blocked;
+        QString item;
+        PageId front;
+    } cases[] = {{false, logPath(), good, PageId::B3},
+                 {false, folder() / u"!105_1234.jpp", good, PageId::FtpFrm},
+                 {true, folder() / u"!105_1234.jpp", good, PageId::B3},
+                 {false, {}, bad, PageId::FtpFrm},
+                 {true, {}, bad, PageId::B3},
+                 {true, {}, good, PageId::FtpFrm}};
+    for (const auto& c : cases) {
+        SCOPED_TRACE(&c - cases);
+        state.Careful = c.careful;
+        B3& page = open({c.item});
+        onceClaimed([&] {
+            if (!c.blocked.isEmpty())
+                makeFolder(c.blocked);
+        });
+        page.Timer2_Tick();
+        EXPECT_EQ(front(), c.front);
+        EXPECT_EQ(printFiles().size(), c.item == good ? 1 : 0);
+        chain.unload(front());
+        std::filesystem::remove_all(host(folder()));
+        state.MisparHazmana = u"105"_s;
+    }
 }
 
 TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {

@@ -149,20 +149,16 @@ TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
     QStringList items;
     for (int i = 0; i < 8; ++i)
         items += line(givePicture(u"pic%1.jpg"_s.arg(i)));
-    leaveAtTheThird(openWith(items), &Form2::Command3_Click, &Form2::Command7_Click);
-}
-
-TEST_F(PreparingAPlainOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
-    const SmallDisk disk(200);
-    expectFullDiskLosesNothing(disk, [this](const QStringList& paths) {
-        QStringList items;
-        for (const QString& path : paths)
-            items += line(path);
-        Form2& page = openWith(items);
-        const TextList& failed = page.controls().List4fail;
-        page.Command3_Click();
-        return failed.items();
-    });
+    Form2& page = openWith(items);
+    machine.pump.onPump = [&] {
+        if (page.controls().Label17.text == u"3"_s)
+            page.Command7_Click();
+    };
+    page.Command3_Click();
+    EXPECT_TRUE(chain.hasEnded());
+    EXPECT_LT(printFiles().size(), 5);
+    EXPECT_FALSE(machine.files.fileExists(logPath()));
+    EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_path)) << "an abandoned order burns no number";
 }
 
 TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinishedOrders) {
@@ -192,6 +188,61 @@ TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinished
     EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "109\r\n");
 }
 
+TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePictures) {
+    registerBare({PageId::kyoskNew});
+    const QString good = line(givePicture(u"good.jpg"_s)), bad = line(giveFile(u"bad.jpg"_s, "no picture"));
+    const QStringList mixed = {good, bad, line(u"C:\\pics\\caf?.jpg"_s), line(u"C:\\pics\\gone.jpg"_s),
+                               line(u"C:\\x.png"_s)};
+    const QString named = u"bad.jpg – לא ניתן לקרוא את הקובץ|caf?.jpg – בשם הקובץ יש אות שאינה נתמכת|"
+                          u"gone.jpg – הקובץ לא נמצא|x.png – אינה קובץ jpg"_s;
+    enum class Answer { None, GoOn, Back };
+    const struct {
+        bool careful, station;
+        QStringList items;
+        QString named;
+        Answer answer;
+        PageId front;
+        bool counted;
+        int leftOut;
+    } cases[] = {{false, false, mixed, {}, Answer::None, PageId::FtpFrm, true, 4}, // the sending page asks
+                 {true, false, mixed, {}, Answer::None, PageId::FtpFrm, true, 4},
+                 {false, true, {good}, {}, Answer::None, PageId::hatchala, true, 0},
+                 {false, true, mixed, named, Answer::GoOn, PageId::hatchala, true, 4},
+                 {false, true, mixed, named, Answer::Back, PageId::kyoskNew, true, 0},
+                 {false, false, {bad}, {}, Answer::None, PageId::FtpFrm, true, 1},
+                 {true, false, {bad}, named.section(u'|', 0, 0), Answer::Back, PageId::kyoskNew, false, 0},
+                 {true, false, {bad}, named.section(u'|', 0, 0), Answer::GoOn, PageId::Form2, false, 1}};
+    for (const auto& c : cases) {
+        SCOPED_TRACE(&c - cases);
+        state.Careful = c.careful;
+        state.TachanaMekomit = c.station;
+        state.handOver.basket = c.items;
+        Form2& page = openWith(c.items);
+        page.setTexts();
+        page.Command3_Click();
+        if (front() == PageId::Form2) {
+            const LeftOutControls& shown = page.controls().leftOut;
+            EXPECT_TRUE(shown.Pic4Hasserot.visible);
+            EXPECT_EQ(shown.List4Hasserot.items().join(u'|'), c.named);
+            page.Command3_Click(); // nothing is prepared behind the box
+            c.answer == Answer::GoOn ? page.Command4Bli_Click() : page.Command4Hazor_Click();
+        }
+        EXPECT_EQ(front(), c.front);
+        EXPECT_EQ(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_path), c.counted);
+        EXPECT_EQ(machine.files.folderExists(folder()), c.answer != Answer::Back);
+        EXPECT_EQ(state.transfer.leftOut.size(), c.leftOut);
+        EXPECT_EQ(state.handOver.back, c.answer == Answer::Back);
+        EXPECT_EQ(state.handOver.notice.contains(u"4 תמונות"_s), c.answer == Answer::GoOn && c.station);
+        EXPECT_EQ(state.handOver.basket, c.items);
+        EXPECT_EQ(state.MisparHazmana, u"105"_s);
+        for (const PageId id : {PageId::FtpFrm, PageId::kyoskNew, PageId::hatchala, PageId::Form2})
+            chain.unload(id);
+        std::filesystem::remove_all(host(folder()));
+        std::filesystem::remove(host(u"C:\\vedron\\mispar.txt"_path));
+        state.handOver = {};
+    }
+}
+
 TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) {
     registerBare({PageId::MoogMeret});
     state.TmunatPaar = 1;
@@ -204,6 +255,15 @@ TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) 
 TEST_F(PreparingAPlainOrder, goesOnWithoutAPrintAndTheCounterButNotWithoutTheLog) {
     const QString one = givePicture(u"one.jpg"_s);
     const DrivePath print = folder() / u"1 1015GNB0000_016F6E65.jpp";
+    const DrivePath sheet = folder() / u"!105_1234.jpp";
+    state.Careful = true;
+    onceClaimed([&] { makeFolder(sheet); });
+    openWith({line(one)}).Command6_Click();
+    EXPECT_EQ(front(), PageId::Form2) << "carefully not without its sheet either";
+    chain.unload(PageId::Form2);
+    std::filesystem::remove_all(host(folder()));
+    machine.dialogs.messages.clear();
+    state.Careful = false;
     makeFolder(u"C:\\vedron\\mispar.txt"_s);
     Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
     onceClaimed([&] {

@@ -71,20 +71,6 @@ protected:
         };
     }
 
-    // The customer leaves the program while the third of eight pictures is prepared.
-    template <class P>
-    void leaveAtTheThird(P& page, void (P::*start)(), void (P::*leave)()) {
-        machine.pump.onPump = [&page, leave] {
-            if (page.controls().Label17.text == u"3"_s)
-                (page.*leave)();
-        };
-        (page.*start)();
-        EXPECT_TRUE(chain.hasEnded());
-        EXPECT_LT(printFiles().size(), 5);
-        EXPECT_FALSE(machine.files.fileExists(logPath()));
-        EXPECT_FALSE(machine.files.fileExists(u"C:\\vedron\\mispar.txt"_path)) << "an abandoned order burns no number";
-    }
-
     // The workspace on a disk that runs full in the middle of the order; prepare gives the paths that failed. Where
     // this user may not mount a disk, files that may not grow beyond a limit stand in for it.
     void expectFullDiskLosesNothing(const SmallDisk& disk,

@@ -1,6 +1,5 @@
 #include "order/EditRecord.h"
 #include "selection/Basket.h"
-#include "selection/FinishRule.h"
 #include "selection/FolderPager.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
@@ -243,22 +242,6 @@ TEST(APrintGrade, goesByThePixelCountAlone) {
     EXPECT_EQ(largeViewSize({1000, 1000}), (PictureSize{300, 300}));
     EXPECT_EQ(largeViewSize({4000, 3000}), (PictureSize{400, 300}));
     EXPECT_EQ(largeViewSize({3000, 4000}), (PictureSize{300, 400}));
-}
-
-TEST(AFinish, compressesLargePrintsAsThePolicySays) {
-    struct Case {
-        const char* paper;
-        DeepCompression asking;
-        DeepCompression always;
-    };
-    for (const Case& c : {Case{"30/45", DeepCompression::Ask, DeepCompression::On},
-                          Case{"50/70", DeepCompression::Ask, DeepCompression::On},
-                          Case{"20/30", DeepCompression::Off, DeepCompression::Off},
-                          Case{"", DeepCompression::Off, DeepCompression::Off},
-                          Case{"zz/zz", DeepCompression::Off, DeepCompression::Off}}) {
-        EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 1), c.asking) << c.paper;
-        EXPECT_EQ(deepCompression(QString::fromLatin1(c.paper), 2), c.always) << c.paper;
-    }
 }
 
 } // namespace

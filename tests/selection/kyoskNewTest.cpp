@@ -114,18 +114,6 @@ TEST_F(ThePictures, ofAPathOutsideTheCodePageAreRefusedInThreeLinesInPlainModesO
     EXPECT_EQ(machine.dialogs.messages.last(), u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
 }
 
-TEST_F(ThePictures, leaveACellEmptyForAFileThatCannotBeRead) {
-    makeFolder(u"C:\\p"_s);
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\p\\02.txt.jpg"_path, "no picture"));
-    kyoskNew& page = openWith(2);
-    EXPECT_EQ(shownCells(page), 2);
-    page.Picture1_Click(0);
-    const QString grade = page.controls().Label6.text;
-    page.Picture1_Click(2);
-    EXPECT_EQ(page.controls().List1.count(), 2);
-    EXPECT_EQ(page.controls().Label6.text, grade);
-}
-
 TEST_F(ThePictures, areDrawnByTheLatestClickWhenClicksArriveMeanwhile) {
     kyoskNew& page = openWith(30);
     int pumps = 0;
@@ -368,17 +356,28 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     EXPECT_EQ(state.handOver.lines, QStringList({u"1 1015GNBC:\\p\\01.jpg"_s, u"2 1015GNBC:\\p\\02.jpg"_s}));
     EXPECT_TRUE(state.handOver.pressStart);
     EXPECT_EQ(state.shemot.Mail + u'|' + state.shemot.Hearot, u"dana@example.com|gift - "_s);
+
+    state.handOver.back = true; // a picture could not be prepared
+    const kyoskNewControls& again = open().controls();
+    EXPECT_EQ(again.List1.items(), state.handOver.lines);
+    EXPECT_EQ(again.List4.items(), QStringList({u"C:\\p\\01.jpg"_s, u"C:\\p\\02.jpg"_s}));
+    EXPECT_EQ(again.Label7.text + again.Label4[1].text + again.Text1.text + again.Text2.text, u"32danagift"_s);
+    chain.unload(PageId::kyoskNew);
+    EXPECT_TRUE(open().controls().List1.isEmpty()) << "once";
 }
 
 TEST_F(ThePictures, askInTheClosingPanelForWhatTheLabWants) {
     const struct {
+        QString paper;
         int policy;
-        bool optionalMail, station, asksForDepth, asksForAddress, mustHaveOne;
-    } cases[] = {{2, false, false, false, true, true},
-                 {1, true, false, true, true, false},
-                 {0, false, true, false, false, false}};
-    state.shemot.ppr = u"30/45"_s;
+        bool optionalMail, station, deep, asksForDepth, asksForAddress, mustHaveOne;
+    } cases[] = {{u"30/45"_s, 2, false, false, true, false, true, true},
+                 {u"50/70"_s, 1, true, false, false, true, true, false},
+                 {u"20/30"_s, 1, true, true, false, false, false, false},
+                 {u"zz/zz"_s, 2, false, true, false, false, false, false},
+                 {u"30/45"_s, 0, false, true, false, false, false, false}};
     for (const auto& c : cases) {
+        state.shemot.ppr = c.paper;
         state.MediniyutDchisa = static_cast<std::int16_t>(c.policy);
         state.DoarReshut = c.optionalMail;
         state.TachanaMekomit = c.station;
@@ -387,7 +386,7 @@ TEST_F(ThePictures, askInTheClosingPanelForWhatTheLabWants) {
         page.Image7_Click();
         const kyoskNewControls& shown = page.controls();
         EXPECT_EQ(shown.Picture7.visible, c.asksForDepth) << c.policy;
-        EXPECT_EQ(state.DchisaAmoka, c.policy == 2 ? 1 : 0);
+        EXPECT_EQ(state.DchisaAmoka, c.deep ? 1 : 0);
         EXPECT_EQ(shown.Text1.visible, c.asksForAddress) << c.policy;
         EXPECT_EQ(shown.Label33.visible, c.mustHaveOne) << c.policy;
         page.Command7_Click(); // without an address

@@ -36,6 +36,38 @@ class FtpFrmTest : public ::testing::Test, protected Line {};
 
 } // namespace
 
+TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
+    for (const auto& [careful, back] : {std::pair(false, false), {true, false}, {true, true}}) {
+        Line line;
+        SessionState& state = line.rig.state;
+        state.Careful = careful;
+        state.EnglishTips = 1;
+        state.transfer.leftOut = {{u"C:\\a.jpg"_path}, {u"C:\\b.jpg"_path}};
+        state.handOver.basket = {u"1 1015GNBC:\\a.jpg"_s};
+        line.rig.chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
+        FtpFrm& page = line.rig.start();
+        const LeftOutControls& shown = page.controls().leftOut;
+        EXPECT_TRUE(shown.Pic4Hasserot.visible && shown.Command4Hazor.visible);
+        EXPECT_EQ(page.counting(), !careful) << "the count runs on behind the box";
+        page.Image5_Click();
+        EXPECT_EQ(page.phase(), careful ? SendingPhase::Waiting : SendingPhase::Success);
+        EXPECT_EQ(shown.Command4Hazor.visible, careful) << "no way back once it is sent";
+        if (back) {
+            page.Command4Hazor_Click();
+            EXPECT_EQ(line.rig.chain.front()->id(), PageId::kyoskNew);
+            EXPECT_TRUE(state.handOver.back && !line.rig.test.files.folderExists(FtpFrmRig::folder()));
+            continue;
+        }
+        page.Command4Bli_Click();
+        EXPECT_FALSE(shown.Pic4Hasserot.visible);
+        EXPECT_EQ(page.counting(), careful);
+        line.rig.countDown();
+        EXPECT_EQ(page.phase(), SendingPhase::Success);
+        EXPECT_EQ(shown.Label4Kartis.text, u"2 pictures that you chose are not in the order."_s);
+        EXPECT_FALSE(page.controls().Label4Do.text.contains(u"whole"_s));
+    }
+}
+
 // What the customer reads at each end; which end it is, the rules of the sender decide.
 TEST(FtpFrm, EndsAsTheCustomerIsTold) {
     const struct {

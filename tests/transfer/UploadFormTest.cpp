@@ -19,6 +19,15 @@ struct UploadFormTest : ::testing::Test {
     UploadFormRig rig{lab};
 };
 
+TEST_F(UploadFormTest, CarefullyCountsOnceTheCustomerHasAnsweredAboutWhatWasLeftOut) {
+    rig.state.Careful = true;
+    rig.state.transfer.leftOut = {{u"C:\\a.jpg"_path, LeftOut::Why::Gone}};
+    UploadForm& page = rig.start();
+    EXPECT_TRUE(page.phase() == SendingPhase::Waiting && page.controls().leftOut.Pic4Hasserot.visible);
+    page.Command4Bli_Click();
+    EXPECT_TRUE(page.counting() && page.controls().leftOut.Label4Kartis.visible);
+}
+
 TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {
     const QString log = UploadFormRig::log();
     const QString first = UploadFormRig::first();

@@ -110,6 +110,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     const Files& files = walk.program().platform().files;
     const DrivePath orders = WorkspacePaths::orders(state);
     ASSERT_TRUE(files.makeFolder(orders.folder()).ok() && files.writeWhole(orders, "no folder").ok());
+    state.handOver.basket = state.handOver.lines;
     walk.program().chain().show(PageId::B3);
     auto& page = walk.page<B3>(PageId::B3);
     page.Command5_Click();
@@ -130,6 +131,9 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     page.Command5_Click();
     EXPECT_TRUE(looked);
     walk.waitFor(u"FtpFrm"_s);
+    look(walk, u"27-left-out"_s);
+    walk.press(u"FtpFrm"_s, u"Command4Bli"_s);
+    look(walk, u"27-left-out-told"_s);
 }
 
 TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {

@@ -17,7 +17,7 @@ constexpr int shownForAWhile = 2000; // milliseconds
 } // namespace
 
 B3::B3(SessionState& state, const Platform& platform, PageChain& chain)
-    : PreparationPage(PageId::B3, state, platform, chain)
+    : PreparationPage(PageId::B3, state, platform, chain, leftOut)
     , Timer2(shownForAWhile, [this] { prepare(); })
     , m_preparation(state, platform, *this) {}
 
@@ -63,6 +63,8 @@ void B3::prepare() {
         return;
     setPreparing(false);
     setStage(made ? Stage::Done : Stage::Waiting);
+    if (m_preparation.endedWithoutPrints())
+        askWithoutPrints();
     if (made)
         handOver(m_state.transfer.SugSheliach == Sender::Http ? Outcome::PreparedForHttp : Outcome::PreparedForFtp);
 }
@@ -88,9 +90,9 @@ void B3::printed(const Bitmap& small) {
     Q_EMIT changed();
 }
 
-void B3::sheetDrawn(const Bitmap& sheet) {
+bool B3::sheetDrawn(const Bitmap& sheet) {
     PreparationPage::sheetDrawn(sheet);
-    m_chain.load<gdisave>().saveOrderSheet(Picture5Image);
+    return m_chain.load<gdisave>().saveOrderSheet(Picture5Image);
 }
 
 void B3::setPreparing(bool on) {

@@ -52,7 +52,7 @@ private:
     void packing(int position) override;
     void drawingSheet(int position) override;
     void printed(const Bitmap& small) override;
-    void sheetDrawn(const Bitmap& sheet) override;
+    bool sheetDrawn(const Bitmap& sheet) override;
 
     Ticker Timer2; // 2000 ms: the start by itself
     EditedPreparation m_preparation;

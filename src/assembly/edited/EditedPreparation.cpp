@@ -50,8 +50,12 @@ bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSiz
         if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
             return false;
     }
+    if (isHeldBackForPrints())
+        return false;
     countOrder();
     if (!drawSheet())
+        return false;
+    if (!m_sheetSaved && isHeldBackForSheet({Failure::Kind::Other, m_folder->path().text()}))
         return false;
     m_events.closing();
     return writeLog(OrderLog::Layout::Edited);

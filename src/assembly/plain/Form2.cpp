@@ -11,7 +11,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 Form2::Form2(SessionState& state, const Platform& platform, PageChain& chain)
-    : PreparationPage(PageId::Form2, state, platform, chain)
+    : PreparationPage(PageId::Form2, state, platform, chain, leftOut)
     , m_preparation(state, platform, *this) {}
 
 Form2::~Form2() = default;
@@ -59,16 +59,23 @@ void Form2::prepare() {
         return;
     List4fail.clear();
     keepOnlyJpeg();
-    if (!somethingChosen())
+    if (!somethingChosen()) {
+        tellRemoved();
+        if (!List4removed.isEmpty())
+            askWithoutPrints();
         return;
+    }
     List1.setCurrentIndex(0);
 
     setPreparing(true);
     const bool made = m_preparation.prepare(List1.items());
     if (m_chain.hasEnded())
         return;
+    tellRemoved();
     setPreparing(false);
     setStage(made ? Stage::Done : Stage::Waiting);
+    if (m_preparation.endedWithoutPrints())
+        askWithoutPrints();
     if (!made)
         return;
     const bool toFinishedOrders =
@@ -101,9 +108,19 @@ void Form2::keepOnlyJpeg() {
     Q_EMIT changed();
 }
 
-void Form2::sheetDrawn(const Bitmap& sheet) {
+// What is no JPEG stands neither among the failed pictures nor in the log.
+void Form2::tellRemoved() {
+    QList<LeftOut>& pictures = m_state.transfer.leftOut;
+    if (List1.isEmpty())
+        pictures.clear();
+    for (const QString& path : List4removed.items())
+        pictures += LeftOut{DrivePath(path), LeftOut::Why::NoJpeg};
+}
+
+bool Form2::sheetDrawn(const Bitmap& sheet) {
     PreparationPage::sheetDrawn(sheet);
     Command5.visible = Command8.visible = true;
+    return true;
 }
 
 void Form2::setPreparing(bool on) {

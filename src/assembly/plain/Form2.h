@@ -67,9 +67,10 @@ private:
     void choose(int index);
 
     void keepOnlyJpeg();
+    void tellRemoved();
     void setPreparing(bool on) override;
     void showProgress() override;
-    void sheetDrawn(const Bitmap& sheet) override;
+    bool sheetDrawn(const Bitmap& sheet) override;
 
     void drawAlbumSheet(); // to look at
     void redrawSheet();

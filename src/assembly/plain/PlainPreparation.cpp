@@ -123,6 +123,8 @@ bool PlainPreparation::prepare(const QStringList& lines) {
     Prints prints(m_state, m_platform.files, m_lines, m_there);
     if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
         return false;
+    if (isHeldBackForPrints())
+        return false;
     countOrder();
     return writeLog(isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
 }
@@ -137,6 +139,8 @@ bool PlainPreparation::makeSheet() {
         return false;
     const Result<QByteArray> sheet = encodeJpeg(*drawn, printQuality);
     const Result<void> saved = sheet ? m_platform.files.writeWhole(path, *sheet) : Result<void>(sheet.failure());
+    if (!saved && isHeldBackForSheet(saved.failure()))
+        return false;
     if (!saved)
         notWritten(saved.failure());
     return true;
@@ -149,7 +153,7 @@ void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& print
         return;
     // The selection page writes a question mark for a character that the code page lacks.
     if (HasQuestionMark(m_lines[index])) {
-        notPrepared(line.path);
+        notPrepared(line.path, LeftOut::Why::Name);
         return;
     }
     m_events.inWork(line.path);

@@ -24,7 +24,7 @@ public:
 private:
     class Prints;
 
-    bool makeSheet(); // false when a click ended the program
+    bool makeSheet(); // false when a click ended the program, and where the order is held back
     void packPicture(int index, PrintPacker& packer, Prints& prints);
 };
 

@@ -99,18 +99,20 @@ void gdisave::setTexts() {
 }
 
 // The FTP sender takes the sheet as ".jpp", the HTTP sender and a local station take it as ".jpg".
-void gdisave::saveOrderSheet(const Bitmap& picture) {
+bool gdisave::saveOrderSheet(const Bitmap& picture) {
     PicPic = picture;
     if (!GdiReady)
-        return;
-    const auto save = [this](const QString& ending) {
+        return false;
+    bool saved = true;
+    const auto save = [&](const QString& ending) {
         const QString name = SheetName(m_state.MisparHazmana, m_state.shemot.ser, ending);
-        SaveJpeg(PicPic, OrderFolder::chosen(m_state).filePath(name), 90);
+        saved = SaveJpeg(PicPic, OrderFolder::chosen(m_state).filePath(name), 90) && saved;
     };
     if (m_state.transfer.SugSheliach == Sender::Ftp)
         save(u".jpp"_s);
     if (m_state.transfer.SugSheliach == Sender::Http || m_state.TachanaMekomit)
         save(u".jpg"_s);
+    return saved;
 }
 
 void gdisave::saveProof(const Bitmap& picture) {

@@ -44,8 +44,9 @@ public:
 
     // --- events ---
 
-    void saveOrderSheet(const Bitmap& picture); // quality 90, under the names of the order's sheet
-    void saveProof(const Bitmap& picture);      // quality 70, as 000.jpg
+    bool
+    saveOrderSheet(const Bitmap& picture); // quality 90, under the names of the order's sheet; true if all are saved
+    void saveProof(const Bitmap& picture); // quality 70, as 000.jpg
     void Command6_Click() { saveOrderSheet(PicPic); }
     void Command7_Click() { saveProof(LitlPic); }
 

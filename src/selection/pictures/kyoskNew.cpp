@@ -10,6 +10,11 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
+#include <QTimer>
+
+#include <algorithm>
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -54,6 +59,10 @@ void kyoskNew::load() {
     Label17.visible = Command8.visible = box != AddressBox::None;
     Label33.visible = box != AddressBox::None && !m_state.DoarReshut;
 
+    const QStringList basket = std::exchange(m_state.handOver.basket, {});
+    const QStringList pictures = std::exchange(m_state.handOver.pictures, {});
+    if (std::exchange(m_state.handOver.back, false))
+        takeBack(basket, pictures);
     showChoice();
     if (plain())
         return;
@@ -63,6 +72,21 @@ void kyoskNew::load() {
     connect(&editor(), &tFrmNew::storedMeanwhile, this, &kyoskNew::putRecord);
     connect(&editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);
     connect(&editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
+}
+
+// Address and note are those that were typed before.
+void kyoskNew::takeBack(const QStringList& basket, const QStringList& pictures) {
+    m_choice.takeBack(basket, pictures);
+    m_choice.nextPage();
+    showPictureCount();
+    const OrderDetails& order = m_state.shemot;
+    Text1.text = order.Mail.left(std::max<qsizetype>(0, order.Mail.indexOf(u'@')));
+    Text2.text = order.Hearot.left(std::max<qsizetype>(0, order.Hearot.lastIndexOf(u" - "_s)));
+    // Drawing pumps events, and this page is not shown yet.
+    QTimer::singleShot(0, this, [this] {
+        if (!m_handedOver)
+            drawPage();
+    });
 }
 
 void kyoskNew::say(const char16_t* hebrew, const char16_t* english) {

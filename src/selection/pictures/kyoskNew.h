@@ -117,6 +117,7 @@ private:
     enum class Guide { None, PicturesShown, ChooseByHand };
 
     void say(const char16_t* hebrew, const char16_t* english);
+    void takeBack(const QStringList& basket, const QStringList& pictures);
     void showChoice();
     void askToLeave();
     void endProgram();

@@ -167,7 +167,8 @@ void kyoskNew::handOver(const QString& mail) {
     Timer1.stop();
     Timer2.stop();
     m_platform.pump.pump();
-    m_state.handOver.lines = List1.items();
+    m_state.handOver.lines = m_state.handOver.basket = List1.items();
+    m_state.handOver.pictures = List4.items();
     m_state.handOver.pressStart = plain();
     m_chain.follow(pageId, plain() ? Outcome::PlainChosen : Outcome::EditedChosen);
     // The next order begins with an editor of its own.

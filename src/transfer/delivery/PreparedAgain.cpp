@@ -40,6 +40,7 @@ bool PreparedAgain::handOver(const IsTaken& isTaken) {
             break;
     }
     m_state.handOver.lines = kept.items;
+    m_state.handOver.basket.clear();
     m_state.handOver.pressStart = plain; // the page of edited orders starts by itself
     m_state.handOver.replaced = m_order.folder().path();
     return true;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/LeftOutBox.h"
 #include "session/Caption.h"
 
 namespace lumora {
@@ -17,6 +18,8 @@ struct SendingControls : Controls {
     Caption Pic4Failure{*this, u"Pic4Failure", Caption::At::Hidden};   // card of the failure, at the end
     Caption Command28{*this, u"Command28", Caption::At::Hidden};       // new order
     Caption Image3{*this, u"Image3"};                                  // close
+
+    LeftOutControls leftOut{*this};
 
     // What the operator's area tells of the order.
     Caption Label4Hokhaha{*this, u"Label4Hokhaha", Caption::At::Hidden};   // arrival is proven by names only

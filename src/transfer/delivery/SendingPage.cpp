@@ -36,11 +36,15 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
     , m_chain(chain)
     , m_countdown(countdown)
     , m_shown(shown)
+    , m_leftOut(id, state, platform, chain, shown.leftOut)
     , Timer4Report(reportTick, [this] { watchReport(); }) {
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
         if (page == this)
             QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
     });
+    // What an earlier order lacked says nothing of one that is sent again.
+    if (state.transfer.SugMishloah != Sending::NewOrder)
+        state.transfer.leftOut.clear();
     // The window may be closed or the page unloaded inside a pump of a sending, which must not go on unseen.
     connect(&chain, &PageChain::ended, this, [this] { leave(); });
     connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
@@ -61,6 +65,8 @@ void SendingPage::activate() {
     if (m_activated)
         return;
     m_activated = true;
+    if (m_leftOut.isDue())
+        m_leftOut.open();
     begin();
 }
 
@@ -77,8 +83,35 @@ QString SendingPage::advice(const PhaseLook& row) const {
     return wording(row.advice);
 }
 
+// An order that lacks chosen pictures is not called whole.
+QString SendingPage::adviceOf(const PhaseLook& row) const {
+    const QString text = advice(row);
+    if (m_state.transfer.leftOut.isEmpty())
+        return text;
+    if (row.phase == SendingPhase::Reporting)
+        return wording(partReportingAdvice);
+    return hasArrived(row.phase) && text == wording(sentAdvice) ? wording(partSentAdvice) : text;
+}
+
+void SendingPage::goOnWithout() {
+    if (!m_shown.leftOut.Pic4Hasserot.visible)
+        return;
+    const bool awaited = isAnswerAwaited();
+    m_leftOut.goOnWithout();
+    if (awaited && m_phase == SendingPhase::Waiting)
+        startCount();
+    Q_EMIT changed();
+}
+
+void SendingPage::goBack() {
+    if (!isUnderWay(m_phase))
+        m_leftOut.goBack();
+}
+
 void SendingPage::enter(SendingPhase phase) {
     m_phase = phase;
+    if (isUnderWay(phase))
+        m_leftOut.endWayBack();
     tellPhase();
     Q_EMIT changed();
 }
@@ -86,7 +119,8 @@ void SendingPage::enter(SendingPhase phase) {
 void SendingPage::tellPhase() {
     const PhaseLook& row = look();
     m_shown.Label4Title.text = wording(row.title);
-    m_shown.Label4Do.text = advice(row);
+    m_shown.Label4Do.text = adviceOf(row);
+    m_leftOut.show();
     m_shown.Label4Order.text = wording(u"ההזמנה שלך", u"Your order");
     m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
     showReporting();

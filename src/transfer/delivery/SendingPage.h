@@ -34,6 +34,8 @@ public:
     void Form_Activate() { activate(); }           // the page has come to the front
     void Timer4Report_Tick() { watchReport(); }    // each second of a telling
     void Command4Dooach_Click() { reportAgain(); } // in the operator's area
+    void Command4Bli_Click() { goOnWithout(); }    // in the box of left out pictures
+    void Command4Hazor_Click() { goBack(); }
 
     SendingPhase phase() const { return m_phase; }
     const PhaseLook& look() const;
@@ -58,6 +60,10 @@ protected:
     virtual void showPhase(const PhaseLook& row) = 0;
     // Starts what the page does by itself.
     virtual void begin() = 0;
+    // Starts the count, or waits where an answer is awaited.
+    virtual void startCount() = 0;
+    // The customer is to answer first whether the order goes on without the pictures that were left out.
+    bool isAnswerAwaited() const { return m_leftOut.isAwaited(); }
     // The customer leaves the page or the program: nothing more may be sent.
     virtual void leave() = 0;
     virtual void stopTimers() = 0;
@@ -92,6 +98,9 @@ protected:
     Countdown m_countdown;
 
 private:
+    QString adviceOf(const PhaseLook& row) const;
+    void goOnWithout();
+    void goBack();
     void activateWhenFree();
     void activate();
     void reportAgain();
@@ -101,6 +110,7 @@ private:
     void tellWatched(Telling telling, ReportCalls& calls);
 
     SendingControls& m_shown;
+    LeftOutBox m_leftOut;
     Ticker Timer4Report; // 1000 ms: the watch over a telling
     SendingPhase m_phase = SendingPhase::Preparing;
     bool m_activated = false;

@@ -25,6 +25,12 @@ inline constexpr SendingWords checkingAdvice{u"בודקים אילו קבצים 
                                              u"Checking which files have arrived. Please wait."};
 inline constexpr SendingWords reportingAdvice{u"כל ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
                                               u"The whole order has arrived. Telling the shop, please wait."};
+inline constexpr SendingWords partReportingAdvice{u"מה שבהזמנה הגיע. מודיעים לחנות, נא להמתין.",
+                                                  u"What is in the order has arrived. Telling the shop, please wait."};
+inline constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
+                                         u"The whole order has arrived. You can close, or begin a new order."};
+inline constexpr SendingWords partSentAdvice{u"מה שבהזמנה הגיע. אפשר לסגור או להתחיל הזמנה חדשה.",
+                                             u"What is in the order has arrived. You can close, or begin a new order."};
 inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
                                             u"The order is kept on this computer. Please call the lab."};
 

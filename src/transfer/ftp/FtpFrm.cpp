@@ -69,7 +69,8 @@ bool FtpFrm::busy() const {
 
 // The start controls do nothing during a sending, before the order is listed and after all has arrived.
 bool FtpFrm::canSend() const {
-    return !busy() && !hasArrived(phase()) && phase() != SendingPhase::Preparing && !m_sender.stop.left;
+    return !busy() && !hasArrived(phase()) && phase() != SendingPhase::Preparing && !m_sender.stop.left &&
+           !isAnswerAwaited();
 }
 
 void FtpFrm::stopTimers() {
@@ -109,6 +110,10 @@ void FtpFrm::blink() {
 }
 
 void FtpFrm::startCount() {
+    if (isAnswerAwaited()) {
+        enter(SendingPhase::Waiting);
+        return;
+    }
     Timer1.start();
     enter(SendingPhase::Countdown);
 }

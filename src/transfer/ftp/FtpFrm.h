@@ -91,7 +91,7 @@ private:
     void blink();
     void holdOrGoOn();
     void holdCount();
-    void startCount();
+    void startCount() override;
     void stopTimers() override;
     LabReport& report() override { return m_sender.report; }
     const LabReport& report() const override { return m_sender.report; }

@@ -56,6 +56,10 @@ void UploadForm::stopTimers() {
 }
 
 void UploadForm::startPanel() {
+    if (isAnswerAwaited()) {
+        enter(SendingPhase::Waiting);
+        return;
+    }
     Picture1.visible = Pic4Timer.visible = Picture5.visible = true;
     Picture1Width = 1;
     m_countdown.restart();

@@ -52,6 +52,7 @@ public:
 
 private:
     void begin() override;
+    void startCount() override { startPanel(); }
     void leave() override;
     bool idle() const;
     void growPanel();

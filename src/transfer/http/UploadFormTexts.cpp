@@ -13,6 +13,7 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr SendingWords allWentUp{u"הזמנה זו עלתה במלואה", u"This order went up in full"};
+constexpr SendingWords partWentUp{u"מה שבהזמנה עלה", u"What is in the order went up"};
 constexpr SendingWords startsIn{u" המשלוח יחל בעוד ", u"The sending starts in"};
 constexpr SendingWords secondsWord{u"שניות", u"seconds"};
 constexpr SendingWords stoppedTitle{u"המשלוח נעצר", u"The sending is stopped"};
@@ -29,8 +30,6 @@ constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלו
 // The page never enters Unclear.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
-    constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפשר לסגור או להתחיל הזמנה חדשה.",
-                                      u"The whole order has arrived. You can close the program or begin a new order."};
     static constexpr std::array rows{
         PhaseLook{SendingPhase::Preparing,
                   SendingSign::Asking,
@@ -120,8 +119,9 @@ void UploadForm::showCount() {
     const QString seconds = QString::number(countdown().seconds());
     Label8.text = seconds;
     Label4Count.visible = counts || (phase() == SendingPhase::AllThere && !m_lacking);
+    Label11.text = wording(m_state.transfer.leftOut.isEmpty() ? allWentUp : partWentUp);
     Label4Count.text =
-        counts ? wording(startsIn).trimmed() + u' ' + seconds + u' ' + wording(secondsWord) : wording(allWentUp);
+        counts ? wording(startsIn).trimmed() + u' ' + seconds + u' ' + wording(secondsWord) : Label11.text;
 }
 
 // A failure during the sending is shown without alarm; at the end it explains why the order was not sent.
@@ -164,7 +164,6 @@ void UploadForm::setTexts() {
                           {endClose, u"סגור", u"Close"},
                           {Image5, u"שלח שוב", u"Send again"},
                           {Label9, u"שולח", u"Sending"},
-                          {Label11, allWentUp.hebrew, allWentUp.english},
                           {Label13, startsIn.hebrew, startsIn.english},
                           {Label14, secondsWord.hebrew, secondsWord.english},
                           {Label4Notru, filesLeft.hebrew, filesLeft.english},

@@ -9,7 +9,9 @@ using namespace Qt::StringLiterals;
 
 PreparationView::PreparationView(PreparationPage& page, const SessionState& state, const Theme& theme,
                                  const Caption& title, const Caption& warning, const Caption& warningBelow)
-    : PageView(page, state, theme)
+    : LeftOutView(
+          page, state, theme, page.controls().leftOut, [&page] { page.Command4Bli_Click(); },
+          [&page] { page.Command4Hazor_Click(); })
     , m_page(page)
     , m_title(title)
     , m_gauge(new Gauge(theme, this))
@@ -46,6 +48,7 @@ PictureBox* PreparationView::pictureBox() {
 }
 
 void PreparationView::render() {
+    LeftOutView::render();
     const PreparationControls& c = m_page.controls();
     frame().setTitle(m_title.text);
     m_gauge->show(m_page.share(), m_page.positionText(), m_page.countText());

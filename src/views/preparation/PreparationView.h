@@ -1,7 +1,7 @@
 #pragma once
 
 #include "assembly/PreparationPage.h"
-#include "views/window/PageView.h"
+#include "views/window/LeftOutView.h"
 
 namespace lumora {
 
@@ -10,7 +10,7 @@ class PictureBox;
 
 // What the views of the two preparation pages show alike: how far the work has come, what went wrong, the warning not
 // to delete the pictures yet, the sheet, and the number of prints.
-class PreparationView : public PageView {
+class PreparationView : public LeftOutView {
     Q_OBJECT
 protected:
     // The warning has two lines.

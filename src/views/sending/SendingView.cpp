@@ -15,7 +15,9 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 SendingView::SendingView(SendingPage& page, const SessionState& state, const Theme& theme)
-    : PageView(page, state, theme)
+    : LeftOutView(
+          page, state, theme, page.sendingControls().leftOut, [&page] { page.Command4Bli_Click(); },
+          [&page] { page.Command4Hazor_Click(); })
     , m_page(page)
     , m_gauge(new Gauge(theme, this)) {
     frame().steps().setStep(OrderStep::Sending);
@@ -24,7 +26,7 @@ SendingView::SendingView(SendingPage& page, const SessionState& state, const The
 void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side) {
     QVBoxLayout* progress = inColumn(Space::Small, {Item::room(), {m_gauge, 0, Qt::AlignCenter}, Space::Wide});
     add(*progress, lines);
-    add(*progress, {Item::room()});
+    add(*progress, {Item::room(), makeLeftOutCard()});
     add(*progress, troubles);
     frame().content()->addLayout(inRow(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}), 1);
 }
@@ -99,6 +101,7 @@ void SendingView::bindLists(const std::vector<std::pair<const char16_t*, const T
 }
 
 void SendingView::render() {
+    LeftOutView::render();
     const SendingControls& shown = m_page.sendingControls();
     const PhaseLook& look = m_page.look();
     window()->setWindowTitle(shown.caption.trimmed().isEmpty() ? u"Lumora"_s : shown.caption.simplified());

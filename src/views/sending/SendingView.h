@@ -1,7 +1,7 @@
 #pragma once
 
 #include "transfer/delivery/SendingPage.h"
-#include "views/window/PageView.h"
+#include "views/window/LeftOutView.h"
 
 #include <map>
 
@@ -14,7 +14,7 @@ class Gauge;
 class Overlay;
 
 // The base of the two sending views: title, gauge, the main action of the phase and the keyboard that goes with it.
-class SendingView : public PageView {
+class SendingView : public LeftOutView {
     Q_OBJECT
 protected:
     SendingView(SendingPage& page, const SessionState& state, const Theme& theme);
