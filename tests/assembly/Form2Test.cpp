@@ -85,18 +85,6 @@ TEST_F(PreparingAPlainOrder, carefullyDecodesWhatItCopiesAndPassesOverWarnings) 
     }
 }
 
-TEST_F(PreparingAPlainOrder, skipsShortNamesInSilenceAndFailsNamesOutsideTheCodePage) {
-    const QString good = givePicture(u"abcde.jpg"_s);
-    const QString tooShort = givePicture(u"ajpg"_s);
-    const QString unknown = u"C:\\pics\\????.jpg"_s;
-    Form2& page = openWith({line(tooShort, u"5 "_s), line(unknown, u"2 "_s), line(good)});
-    const TextList& failed = page.controls().List4fail;
-    page.Command6_Click();
-    EXPECT_EQ(failed.items(), QStringList(unknown));
-    EXPECT_EQ(printFiles(), QStringList(u"1 1015GNB0002_016162636465.jpp"_s));
-    EXPECT_EQ(state.shemot.TotalPics, 8) << "skipped names count";
-}
-
 TEST_F(PreparingAPlainOrder, dropsWhatIsNoJpegInTwoWalksThatPassOverTheItemBehindARemovedOne) {
     const QString jpg = line(givePicture(u"a1.jpg"_s));
     const auto other = [](int i) { return line(u"C:\\pics\\x%1.png"_s.arg(i)); };

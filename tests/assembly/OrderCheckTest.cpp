@@ -34,18 +34,10 @@ protected:
     const QString log = u"2026_11_21_KUP_1234^105.txt"_s;
 };
 
-TEST_F(CheckingAnOrder, findsAWholeOrderWhole) {
-    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
-    ASSERT_TRUE(report);
-    EXPECT_EQ(report->faults, QStringList());
-    EXPECT_EQ(report->order, u"2026_11_21_KUP_1234^105"_s);
-    EXPECT_EQ(report->items, 4);
-    EXPECT_EQ(report->prints, 2);
-    EXPECT_EQ(report->failed, 1);
-    EXPECT_EQ(report->copies, 15);
-}
-
 TEST_F(CheckingAnOrder, namesTheFileAtFault) {
+    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
+    ASSERT_TRUE(report && report->faults.isEmpty());
+    EXPECT_EQ(QList({report->items, report->prints, report->failed, report->copies}), QList({4, 2, 1, 15}));
     // A print file whose picture is cut short still falls into its pieces.
     const QByteArray tail = readPrintFile(*machine.files.read(folder() / two), {56, 30})->tail;
     QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);

@@ -222,6 +222,7 @@ bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::I
 
 // The order stays in its folder and is listed among the finished ones.
 void SendingPage::leaveForNewOrder() {
+    m_state.transfer.leftOut.clear();
     m_chain.follow(id(), Outcome::NewOrderWanted);
 }
 
