@@ -77,6 +77,8 @@ TEST(ParseFtpListing, TellsTheLineThatItCannotRead) {
         {line + "b.jpp\r\n", {u"a.jpp"_s}, "b.jpp"},
         {"000.jpg\r\n2026 of ^105\n", {u"000.jpg"_s, u"2026 of ^105"_s}},
         {"000.jpg\r\nls: not found\r\n", {}, "000.jpg"},
+        {"No files found.\r\n", {}, "No files found."},
+        {"my picture.jpg\r\n", {u"my picture.jpg"_s}},
         {"orders/000.jpg\r\n", {}, "orders/000.jpg"},
         {"A.TXT;1   12/34   21-NOV-2026 03:47\r\n", {}, "A.TXT;1   12/34   21-NOV-2026 03:47"},
     };

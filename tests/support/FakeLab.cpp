@@ -81,12 +81,10 @@ public:
     }
 
     Result<void> get(const QString& remoteName, const HostPath& local) override {
-        const FakeLab::Folder& folder = m_lab.folders[m_here];
-        if (isCut() || !folder.contains(remoteName))
-            return isCut() ? Result<void>(cut()) : no(u"550 Failed to open file."_s);
-        const QByteArray& bytes = folder.at(remoteName);
-        std::ofstream(local, std::ios::binary).write(bytes.constData(), bytes.size());
-        return {};
+        return get(remoteName, local, m_lab.convertsText);
+    }
+    Result<void> getExact(const QString& remoteName, const HostPath& local) override {
+        return get(remoteName, local, false);
     }
 
     Result<void> remove(const QString& remoteName) override {
@@ -136,6 +134,16 @@ public:
     QString lastResponse() const override { return m_response; }
 
 private:
+    Result<void> get(const QString& remoteName, const HostPath& local, bool converts) {
+        const FakeLab::Folder& folder = m_lab.folders[m_here];
+        if (isCut() || !folder.contains(remoteName))
+            return isCut() ? Result<void>(cut()) : no(u"550 Failed to open file."_s);
+        QByteArray bytes = folder.at(remoteName);
+        if (converts)
+            bytes.replace("\r\n", "\n");
+        std::ofstream(local, std::ios::binary).write(bytes.constData(), bytes.size());
+        return {};
+    }
     QString below(const QString& name) const { return m_here.isEmpty() ? name : m_here + u'/' + name; }
     bool isCut() const { return m_cut || m_lab.aborts != m_aborts; }
     static bool isBroken(const QString& name) {

@@ -6,6 +6,7 @@
 
 #include <functional>
 #include <map>
+#include <utility>
 #include <vector>
 
 namespace lumora {
@@ -46,6 +47,7 @@ public:
 
     // What a put that is answered well stores of its content; no value: nothing.
     std::function<std::optional<QByteArray>(const QString& name, const QByteArray& content)> stores;
+    bool convertsText = false; // of what is got under type ASCII
     bool listsLengths = true;
     bool tellsSize = true;
 
@@ -69,6 +71,8 @@ public:
                                                       DataChannel channel) override;
     Result<WebAnswer> fetch(const QString& url) override;
     void abort() override { ++aborts; }
+    EventPump* pumpWhileWaiting(EventPump* given) override { return std::exchange(pump, given); }
+    EventPump* pump = nullptr; // while a call waits
 
     DataChannel lastChannel = DataChannel::Passive;
 };

@@ -49,6 +49,10 @@ bool isForeign(char c) {
     return static_cast<unsigned char>(c) >= 0x80;
 }
 
+bool isLetter(char c) {
+    return isForeign(c) || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
+}
+
 bool isNumber(const QByteArray& text) {
     return !text.isEmpty() && std::all_of(text.begin(), text.end(), isDigit);
 }
@@ -69,10 +73,9 @@ bool isEnglishMonth(const QByteArray& text) {
 
 // In whichever language: a word of letters, or a number with a foreign letter.
 bool isMonthWord(const QByteArray& text) {
-    const auto letter = [](char c) { return isForeign(c) || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z'); };
-    return text.size() >= 2 && text.size() <= 24 && std::any_of(text.begin(), text.end(), letter) &&
+    return text.size() >= 2 && text.size() <= 24 && std::any_of(text.begin(), text.end(), isLetter) &&
            std::all_of(text.begin(), text.end(),
-                       [&](char c) { return letter(c) || isDigit(c) || c == '.' || c == ',' || c == '\''; });
+                       [](char c) { return isLetter(c) || isDigit(c) || c == '.' || c == ',' || c == '\''; });
 }
 
 bool isDay(const QByteArray& text) {
@@ -233,6 +236,20 @@ bool isLeafName(const QByteArray& line) {
            });
 }
 
+// A name of at most four letters or digits behind a point, as ".jpp".
+bool hasEnding(const QByteArray& line) {
+    const QByteArray ending = line.mid(line.lastIndexOf('.') + 1);
+    return ending.size() < line.size() && !ending.isEmpty() && ending.size() <= 4 &&
+           std::all_of(ending.begin(), ending.end(), [](char c) { return isLetter(c) || isDigit(c); });
+}
+
+// Words, as "No files found"; the names of orders and their files have signs or endings that words lack.
+bool isSentence(const QByteArray& line) {
+    return line.contains(' ') && !hasEnding(line) && std::all_of(line.begin(), line.end(), [](char c) {
+               return isLetter(c) || isDigit(c) || QByteArray(" .,'!()-").contains(c);
+           });
+}
+
 bool isSum(const QByteArray& line) {
     const QByteArrayList words = line.simplified().split(' ');
     return words.size() == 2 && !isNumber(words[0]) && isNumber(words[1]);
@@ -259,7 +276,8 @@ FtpListing ParseFtpListing(const QByteArray& listing) {
     if (!others.isEmpty() && others.first() == lines.first() && isSum(lines.first()) &&
         (!namesOnly || lines.first().toLower().startsWith("total ")))
         others.removeFirst();
-    if (!namesOnly || !std::all_of(others.begin(), others.end(), isLeafName)) {
+    const bool serversWords = others.size() == 1 && isSentence(others.first());
+    if (!namesOnly || serversWords || !std::all_of(others.begin(), others.end(), isLeafName)) {
         read.unread = others.isEmpty() ? QString() : AnsiCodePage::decode(others.first());
         return read;
     }

@@ -323,9 +323,10 @@ Result<Poco::Net::ServerSocket> FtpSessionWire::openActive() {
     return listener;
 }
 
-Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction direction, const Transfer& move) {
+Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction direction, const Transfer& move,
+                                      std::optional<FtpType> type) {
     m_transferCode = 0;
-    if (const auto typed = setType(m_type); !typed)
+    if (const auto typed = setType(type.value_or(m_type)); !typed)
         return typed;
     LineSocket data;
     Poco::Net::ServerSocket listener;
@@ -429,7 +430,7 @@ Result<void> FtpSessionWire::put(const HostPath& local, const QString& remoteNam
     });
 }
 
-Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& local) {
+Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& local, std::optional<FtpType> type) {
     const auto name = argumentBytes(remoteName);
     if (!name)
         return name.failure();
@@ -437,18 +438,21 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
     if (content.failed())
         return content.commit();
     auto received = guarded([&] {
-        return transfer("RETR " + *name, Direction::Down, [&](StreamSocket& data) -> Result<void> {
-            std::vector<char> bytes(chunk);
-            for (;;) {
-                const int count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
-                if (count <= 0)
-                    return {};
-                m_call.moved(count);
-                content.append(bytes.data(), static_cast<std::size_t>(count));
-                if (content.failed())
-                    return content.commit();
-            }
-        });
+        return transfer(
+            "RETR " + *name, Direction::Down,
+            [&](StreamSocket& data) -> Result<void> {
+                std::vector<char> bytes(chunk);
+                for (;;) {
+                    const int count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
+                    if (count <= 0)
+                        return {};
+                    m_call.moved(count);
+                    content.append(bytes.data(), static_cast<std::size_t>(count));
+                    if (content.failed())
+                        return content.commit();
+                }
+            },
+            type);
     });
     return received ? content.commit() : received;
 }

@@ -28,7 +28,8 @@ public:
     Result<void> changeDirectory(const QString& directory);
     Result<QString> currentDirectory();
     Result<void> put(const HostPath& local, const QString& remoteName);
-    Result<void> get(const QString& remoteName, const HostPath& local);
+    // type: none for that of the line.
+    Result<void> get(const QString& remoteName, const HostPath& local, std::optional<FtpType> type);
     Result<FtpListing> list(const QString& pattern, EmptyFolder empty);
     Result<std::optional<qint64>> length(const QString& remoteName);
 
@@ -59,7 +60,8 @@ private:
     Result<Poco::Net::ServerSocket> openActive();
     enum class Direction { Up, Down };
     // Opens a data connection, gives the command, moves the bytes and judges the reply that closes the transfer.
-    Result<void> transfer(const QByteArray& line, Direction direction, const Transfer& move);
+    Result<void> transfer(const QByteArray& line, Direction direction, const Transfer& move,
+                          std::optional<FtpType> type = std::nullopt);
     Result<void> endOfPut(Poco::Net::StreamSocket& data);
 
     LineCall m_call;

@@ -52,6 +52,8 @@ public:
     // Under the transfer type of the line, bytes as they are.
     virtual Result<void> put(const HostPath& local, const QString& remoteName) = 0;
     virtual Result<void> get(const QString& remoteName, const HostPath& local) = 0;
+    // The file's own bytes, under type image.
+    virtual Result<void> getExact(const QString& remoteName, const HostPath& local) = 0;
     virtual Result<void> remove(const QString& remoteName) = 0;
 
     // What the current directory holds. The pattern "*.*" means every name and is sent as a plain LIST, since a server
@@ -101,8 +103,9 @@ public:
     // Cuts every connection that stands; each call under way fails at once, and a put that was cut is a broken put.
     // From any thread. Later calls are not concerned.
     virtual void abort() {}
-    // While a pump is given, a call that waits on its thread pumps, so that a click may abort it.
-    virtual void pumpWhileWaiting(EventPump*) {}
+    // While a pump is given, a call that waits on its thread pumps, so that a click may abort it. Gives the pump that
+    // was given before.
+    virtual EventPump* pumpWhileWaiting(EventPump*) { return nullptr; }
     // A running count of the bytes of files, listings and bodies in both directions.
     virtual qint64 bytesMoved() const { return 0; }
 
@@ -116,7 +119,7 @@ public:
     virtual Result<WebAnswer> post(const QString& url, const PostRequest& request) = 0;
 
     // The length in bytes that the server tells of an address, asked by HEAD; no value where it does not answer 200 to
-    // 299 or tells none.
+    // 299 or tells none. 404 and 410 are the failure NotFound.
     virtual Result<std::optional<qint64>> contentLength(const QString& url) = 0;
 
     // GET into a file, written whole or not at all; an answer of another status than 200 to 299, and one

@@ -55,7 +55,10 @@ public:
         return run([&](FtpSessionWire& wire) { return wire.put(local, remoteName); });
     }
     Result<void> get(const QString& remoteName, const HostPath& local) override {
-        return run([&](FtpSessionWire& wire) { return wire.get(remoteName, local); });
+        return run([&](FtpSessionWire& wire) { return wire.get(remoteName, local, std::nullopt); });
+    }
+    Result<void> getExact(const QString& remoteName, const HostPath& local) override {
+        return run([&](FtpSessionWire& wire) { return wire.get(remoteName, local, FtpType::Image); });
     }
     Result<void> remove(const QString& remoteName) override {
         return run([&](FtpSessionWire& wire) { return wire.command("DELE", remoteName); });
@@ -86,8 +89,8 @@ void PocoInternet::abort() {
     m_line->abort.abort();
 }
 
-void PocoInternet::pumpWhileWaiting(EventPump* pump) {
-    m_line->pump = pump;
+EventPump* PocoInternet::pumpWhileWaiting(EventPump* pump) {
+    return std::exchange(m_line->pump, pump);
 }
 
 qint64 PocoInternet::bytesMoved() const {
@@ -157,6 +160,8 @@ Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {
             const auto answer = HttpHead(url, line);
             if (!answer)
                 return answer.failure();
+            if (answer->status == 404 || answer->status == 410)
+                return Failure{Failure::Kind::NotFound, u"%1: the server has no such file"_s.arg(url)};
             return answer->good() ? answer->length : Length();
         },
         m_line->pump);

@@ -17,7 +17,7 @@ public:
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
     void abort() override;
-    void pumpWhileWaiting(EventPump* pump) override;
+    EventPump* pumpWhileWaiting(EventPump* pump) override;
     qint64 bytesMoved() const override;
     Result<WebAnswer> fetch(const QString& url) override;
     Result<WebAnswer> post(const QString& url, const PostRequest& request) override;

@@ -9,15 +9,15 @@ namespace lumora {
 class StoppableLine {
 public:
     explicit StoppableLine(const Platform& platform)
-        : m_internet(platform.internet) {
-        m_internet.pumpWhileWaiting(&platform.pump);
-    }
-    ~StoppableLine() { m_internet.pumpWhileWaiting(nullptr); }
+        : m_internet(platform.internet)
+        , m_before(m_internet.pumpWhileWaiting(&platform.pump)) {}
+    ~StoppableLine() { m_internet.pumpWhileWaiting(m_before); }
     StoppableLine(const StoppableLine&) = delete;
     StoppableLine& operator=(const StoppableLine&) = delete;
 
 private:
     Internet& m_internet;
+    EventPump* m_before; // of a call on the line inside which this one runs
 };
 
 } // namespace lumora

@@ -52,7 +52,7 @@ FtpFolderOwner::Log FtpFolderOwner::logThere(const OrderJournal& order, FtpConne
     const Result<HostPath> target = m_files.host(fetched);
     if (!target)
         return Log::NotKnown;
-    const Result<void> got = connection.get(log.leaf(), *target);
+    const Result<void> got = connection.getExact(log.leaf(), *target);
     const Result<QByteArray> theirs = got ? m_files.read(fetched) : Result<QByteArray>(got.failure());
     static_cast<void>(m_files.removeFile(fetched)); // hidden; the next fetch replaces one that stays
     if (!theirs) {

@@ -174,6 +174,8 @@ TEST_P(FtpContract, WalksMakesPutsListsMeasuresGetsAndDeletes) {
         ASSERT_TRUE(ftp.get(u"a b.jpp"_s, back));
         // The bytes may come as text does, with line ends of two bytes.
         EXPECT_TRUE(contentOf(back) == bytes || GetParam().type == FtpType::Ascii);
+        ASSERT_TRUE(ftp.getExact(u"a b.jpp"_s, back));
+        EXPECT_EQ(contentOf(back), bytes);
         expectRefused(ftp.get(u"none"_s, toHostPath(local.path()) / "never"), ftp);
         EXPECT_FALSE(fs::exists(toHostPath(local.path()) / "never"));
         ASSERT_TRUE(ftp.remove(u"a b.jpp"_s));

@@ -194,7 +194,7 @@ TEST_F(HttpTest, TellsALengthByHead) {
         std::optional<qint64> length;
     } cases[] = {{"HTTP/1.1 200 OK\r\nContent-Length: 9424170000\r\n\r\n", 9424170000},
                  {"HTTP/1.1 200 OK\r\n\r\n", std::nullopt},
-                 {"HTTP/1.1 404 Not Found\r\nContent-Length: 9\r\n\r\n", std::nullopt}};
+                 {"HTTP/1.1 405 Not Allowed\r\nContent-Length: 9\r\n\r\n", std::nullopt}};
     for (const auto& each : cases) {
         ScriptedWeb web({each.answer});
         const auto length = internet.contentLength(web.site() + u"/x"_s);
@@ -202,6 +202,8 @@ TEST_F(HttpTest, TellsALengthByHead) {
         EXPECT_EQ(*length, each.length);
         EXPECT_TRUE(web.requests().first().startsWith("HEAD /x HTTP/1.1\r\n"));
     }
+    ScriptedWeb web({"HTTP/1.1 404 Not Found\r\nContent-Length: 9\r\n\r\n"});
+    EXPECT_EQ(internet.contentLength(web.site() + u"/x"_s).failure().kind, Failure::Kind::NotFound);
 }
 
 TEST_F(HttpTest, AnAbortEndsACall) {
