@@ -35,6 +35,14 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+void warn(const QString& text) {
+    std::fprintf(stderr, "lumora: %s\n", qPrintable(text));
+}
+
+} // namespace
+
 // Each member uses only those above it.
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line)
@@ -43,7 +51,8 @@ struct Program::Parts {
         , files(drives)
         , instances(std::move(run))
         , fileSystem(drives)
-        , volume(fileSystem, dataFolder, NetworkCards())
+        , volume(fileSystem, dataFolder, NetworkCards(),
+                 [](const Failure& why) { warn(u"the mark of the data folder can't be kept: %1"_s.arg(why.message)); })
         , internet({}, deployment.ftpType)
         , shell(drives)
         , chain(pump)
@@ -101,7 +110,7 @@ Result<void> Program::start() {
     if (labFile)
         reading = ReadLabFile(*labFile);
     for (const QString& warning : reading.warnings)
-        std::fprintf(stderr, "lumora: %s\n", qPrintable(warning));
+        warn(warning);
     if (!reading.errors.isEmpty())
         return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
     if (m_options.operatorArea)
@@ -125,6 +134,14 @@ Result<void> Program::start() {
 
     const auto startTime = std::filesystem::file_time_type::clock::now();
     Instances run(dataFolder, reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared);
+    if (run.fault() && reading.deployment.Careful) {
+        return Failure{Failure::Kind::InUse,
+                       u"the data folder can't be locked, and another program in it would not be noticed: %1\n"
+                       "\u2067לא ניתן לנעול את תיקיית הנתונים, ולכן תוכנה נוספת שפועלת בה לא תתגלה.\u2069"_s.arg(
+                           run.fault()->message)};
+    }
+    if (run.fault())
+        warn(u"the data folder can't be locked: %1"_s.arg(run.fault()->message));
     if (run.refused()) {
         m_otherCameForward = CallForward(dataFolder);
         return Failure{

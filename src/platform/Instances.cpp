@@ -3,10 +3,15 @@
 #include <fcntl.h>
 
 #include <cerrno>
+#include <cstring>
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 namespace {
+
+constexpr char lockFile[] = ".lumora-runs";
 
 struct flock wholeFile(short kind) {
     struct flock lock = {};
@@ -18,10 +23,15 @@ struct flock wholeFile(short kind) {
 } // namespace
 
 Instances::Instances(const HostPath& dataFolder, Lock lock)
-    : m_file(::open((dataFolder / ".lumora-runs").c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)) {
+    : m_file(::open((dataFolder / lockFile).c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600)) {
     struct flock mine = wholeFile(lock == Lock::Exclusive ? F_WRLCK : F_RDLCK);
-    if (m_file.valid() && ::fcntl(m_file.number(), F_OFD_SETLK, &mine) != 0)
-        m_refused = errno == EAGAIN || errno == EACCES;
+    if (m_file.valid() && ::fcntl(m_file.number(), F_OFD_SETLK, &mine) == 0)
+        return;
+    const int why = errno;
+    m_refused = m_file.valid() && (why == EAGAIN || why == EACCES);
+    if (!m_refused)
+        m_fault = Failure{Failure::Kind::AccessDenied,
+                          toText(dataFolder / lockFile) + u": "_s + QString::fromLocal8Bit(std::strerror(why))};
 }
 
 bool Instances::another() const {

@@ -1,7 +1,10 @@
 #pragma once
 
 #include "common/HostFile.h"
+#include "common/Result.h"
 #include "platform/files/HostPath.h"
+
+#include <optional>
 
 namespace lumora {
 
@@ -15,6 +18,8 @@ public:
 
     // True where the lock of another instance excludes this one. False also when the folder takes no lock.
     bool refused() const { return m_refused; }
+    // Why the folder takes no lock, so that no other instance is noticed; no value where it does.
+    const std::optional<Failure>& fault() const { return m_fault; }
 
     // True while another instance holds the lock. False also when the folder takes no lock.
     bool another() const;
@@ -22,6 +27,7 @@ public:
 private:
     Descriptor m_file;
     bool m_refused = false;
+    std::optional<Failure> m_fault;
 };
 
 } // namespace lumora

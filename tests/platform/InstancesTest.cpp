@@ -20,7 +20,6 @@ TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAsLongAsBothAreThere) {
     EXPECT_FALSE(stranger.another());
     second.reset();
     EXPECT_FALSE(first.another());
-    EXPECT_FALSE(Instances("/proc/no such folder").another());
 }
 
 TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
@@ -36,13 +35,15 @@ TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
         const QTemporaryDir folder;
         const QTemporaryDir elsewhere;
         std::optional<Instances> one(std::in_place, folder.path().toStdString(), first);
-        EXPECT_FALSE(one->refused());
+        EXPECT_FALSE(one->refused() || one->fault());
         EXPECT_EQ(Instances(folder.path().toStdString(), second).refused(), refused);
         EXPECT_FALSE(Instances(elsewhere.path().toStdString(), second).refused()) << "another data folder";
         one.reset();
         EXPECT_FALSE(Instances(folder.path().toStdString(), second).refused()) << "the first has ended";
     }
-    EXPECT_FALSE(Instances("/proc/no such folder", Lock::Exclusive).refused());
+    const Instances none("/proc/no such folder", Lock::Exclusive);
+    EXPECT_FALSE(none.refused() || none.another());
+    EXPECT_TRUE(none.fault()->message.contains(QStringLiteral("No such file")));
 }
 
 } // namespace lumora

@@ -6,6 +6,7 @@
 #include <QRandomGenerator>
 
 #include <optional>
+#include <utility>
 
 namespace lumora {
 
@@ -35,12 +36,12 @@ std::optional<FolderMark> readMark(const HostPath& file) {
     return numberTold ? std::optional(mark) : std::nullopt;
 }
 
-bool keepMark(const HostPath& file, const FolderMark& mark) {
+Result<void> keepMark(const HostPath& file, const FolderMark& mark) {
     ListOutput output;
     output.text(u"Mark"_s).number(mark.number).endLine();
     for (const QString& card : mark.cards)
         output.pair(u"Card"_s, card);
-    return writeWholeFile(file, output.bytes()).ok();
+    return writeWholeFile(file, output.bytes());
 }
 
 } // namespace
@@ -54,8 +55,11 @@ Result<std::int32_t> MarkedVolume::serial(const DrivePath& driveRoot) const {
     const bool ours = mark && (m_cards.isEmpty() || mark->cards == m_cards);
     if (!ours) {
         mark = FolderMark{QRandomGenerator::system()->generate(), m_cards};
-        if (!keepMark(m_file, *mark))
+        if (const Result<void> kept = keepMark(m_file, *mark); !kept) {
+            if (!std::exchange(m_told, true))
+                m_notKept(kept.failure());
             return plain;
+        }
     }
     return static_cast<std::int32_t>(static_cast<std::uint32_t>(*plain) ^ mark->number);
 }
