@@ -1,5 +1,6 @@
 #include "order/OrderNames.h"
 
+#include "common/DrivePath.h"
 #include "common/FixedText.h"
 
 namespace lumora {
@@ -23,6 +24,13 @@ QString SheetName(const QString& number, const QString& serial, const QString& e
 
 bool IsSheet(const QString& leaf) {
     return leaf.startsWith(u'!');
+}
+
+QStringList LeafNames(const QStringList& paths) {
+    QStringList names;
+    for (const QString& path : paths)
+        names += LeafName(path);
+    return names;
 }
 
 bool TravelsInPieces(const QString& folder) {

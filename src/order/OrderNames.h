@@ -2,6 +2,7 @@
 
 #include <QDate>
 #include <QString>
+#include <QStringList>
 
 // Names of an order and of the files in its folder, as the lab's tools expect them.
 namespace lumora {
@@ -17,6 +18,9 @@ QString OrderNumberOf(const QString& name);
 // The leaf name of the order sheet, "!number_serial" and ending: ".jpp", or ".jpg" for the copy that is no print file.
 QString SheetName(const QString& number, const QString& serial, const QString& ending);
 bool IsSheet(const QString& leaf);
+
+// The leaf names of these paths, in their order.
+QStringList LeafNames(const QStringList& paths);
 
 // True when the folder's path or leaf name ends in "P": the order is sent in pieces.
 bool TravelsInPieces(const QString& folder);

@@ -174,7 +174,7 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
         {whole, "", true, text + u"!104_1234.jpp 02a.jpp 11b.JPG"_s, "!104_1234.jpp 02a.jpp 11b.JPG"},
         {whole, "02a.jpp", false, text + u"02a.jpp !104_1234.jpp"_s, "!104_1234.jpp 02a.jpp"},
         {whole, "", false, text + u"!104_1234.jpp"_s, "!104_1234.jpp"},
-        {pieces, "", true, pieces + u".txt !105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"_s,
+        {pieces, "kashloo.txt", true, pieces + u".txt !105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"_s,
          "!105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"},
     };
     for (const Case& c : cases) {

@@ -58,6 +58,8 @@ std::int16_t FilesToSend::familyCount() const {
 
 QStringList FilesToSend::markedPaths() const {
     QStringList paths = markedNames();
+    const QString broken = OrderFolder(m_folder).brokenFilesPath().leaf();
+    paths.removeIf([&](const QString& name) { return name.compare(broken, Qt::CaseInsensitive) == 0; });
     for (QString& path : paths)
         path = (m_folder / path).text();
     return paths;

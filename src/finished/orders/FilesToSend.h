@@ -38,7 +38,8 @@ public:
     std::int16_t familyCount() const;
 
     // Full paths for a new sending: the order's log, if there is one, the marked files, then a sheet that is not
-    // marked. Empty when there is neither a log nor a marked file.
+    // marked. Empty when there is neither a log nor a marked file. The list of broken files, which is of no order,
+    // never travels.
     QStringList resendList() const;
     // Full paths for the mail, one package each: a sheet that is not marked, then the marked files.
     QStringList mailList() const;

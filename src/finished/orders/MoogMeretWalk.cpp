@@ -2,11 +2,13 @@
 #include "common/DrivePath.h"
 #include "finished/mail/MailLetter.h"
 #include "finished/mail/MailResult.h"
+#include "finished/mail/UnsentPackages.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/CompletenessGuard.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
+#include "order/OrderNames.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 
@@ -47,9 +49,7 @@ void MoogMeret::sendByMail() {
 }
 
 bool MoogMeret::mayBeMailed() {
-    QStringList marked;
-    for (const QString& path : List1.items())
-        marked += LeafName(path);
+    const QStringList marked = LeafNames(List1.items());
     const OrderFolder order(m_files.folder());
     m_walksWholeOrder =
         OrderCompleteness::read(m_platform.files, order, marked).verdict() == OrderCompleteness::Verdict::Whole;
@@ -58,9 +58,8 @@ bool MoogMeret::mayBeMailed() {
 
 // After a stop, with the same files marked, the customer chooses whether what was sent is sent again.
 bool MoogMeret::asksToGoOn() {
-    const int unsent = m_walk.count() - m_walk.count(PackageWalk::Fate::Sent);
-    return m_state.Careful && m_phase == Phase::Walked && m_walk.count(PackageWalk::Fate::Sent) > 0 && unsent > 0 &&
-           List1.items() == m_files.mailList() &&
+    const int unsent = m_phase == Phase::Walked ? UnsentPackages(m_state).toGoOnWith(m_walk) : 0;
+    return unsent > 0 && List1.items() == m_files.mailList() &&
            asks(u"נשארו %1 מנות שלא נשלחו. כן: להמשיך בהן. לא: להתחיל מחדש.",
                 u"%1 packages were not sent. Yes: go on with them. No: begin again.", {QString::number(unsent)}) &&
            mayAct();

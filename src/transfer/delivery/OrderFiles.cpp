@@ -54,13 +54,6 @@ QStringList BulkFiles(const QStringList& handedOver, bool inPieces) {
     return texts + pieces;
 }
 
-QStringList LeafNames(const QStringList& paths) {
-    QStringList names;
-    for (const QString& path : paths)
-        names += LeafName(path);
-    return names;
-}
-
 QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QString& serverList) {
     const DrivePath path(folder.text().trimmed());
     if (path.text().size() < shortestFolder)

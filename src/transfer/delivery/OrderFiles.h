@@ -21,7 +21,4 @@ QStringList BulkFiles(const QStringList& handedOver, bool inPieces);
 // and the list of broken files that a sending by FTP left there.
 QStringList HttpOrderFiles(const Files& files, const DrivePath& folder, const QString& serverList);
 
-// In their order.
-QStringList LeafNames(const QStringList& paths);
-
 } // namespace lumora
