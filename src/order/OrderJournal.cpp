@@ -124,6 +124,12 @@ Result<void> OrderJournal::folderIsRefused() {
     return keep(next);
 }
 
+Result<void> OrderJournal::folderIsLost() {
+    OrderState next = m_state;
+    next.folderMadeByUs = false;
+    return keep(next);
+}
+
 Result<void> OrderJournal::take(const QString& path) {
     makeKnown();
     OrderState next = m_state;

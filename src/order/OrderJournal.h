@@ -40,6 +40,8 @@ public:
     // The server is about to be asked to make the folder; it has refused.
     Result<void> folderIsAsked();
     Result<void> folderIsRefused();
+    // Another order has taken it since: nothing more of this one may go there.
+    Result<void> folderIsLost();
     // The customer sends the order again: without a state, it was sent by an older version. Writes nothing by itself.
     void markSentAgain() { m_sentAgain = true; }
     // A file's full path, before its put and after the put that was confirmed.

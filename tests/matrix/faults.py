@@ -360,6 +360,7 @@ HTTP = [
     Fault('413', {'POST': (says(b'too large', 413), ALWAYS, 2)}),
     Fault('500, once', {'POST': (says(b'', 500), 1, 2)}),
     Fault('500, always', {'POST': says(b'', 500)}),
+    Fault('500, half of a file stored, once, and no HEAD', {'HEAD': says(b'', 405), 'POST': (stored(half, status=500), 1, 2)}),
     Fault('POST: silence, once', {'POST': (silent, 1, 2)}, clock=20, limit=120),
     Fault('POST: silence, always', {'POST': silent}, clock=60),
     Fault('POST: 0.3 kB/s for ever', {'READ': slowly(20_000)}, clock=60),

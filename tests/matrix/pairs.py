@@ -3,6 +3,7 @@ import select
 import shutil
 import socket
 import threading
+import time
 
 from cases import Case, Workspace
 from faults import Fault
@@ -183,6 +184,22 @@ def one_serial_empty_folder(case):
     case.judge(case.mine.end(), second)
 
 
+def one_serial_both_ask(case):
+    """Both have found no folder when the first file of each arrives."""
+    there, go_on = case.hold('POST', 1)
+    case.begin(case.mine)
+    there.wait(100)
+    case.make_other(mark=True)
+    case.begin(case.other)
+    for _ in range(2000):
+        if len(case.web.puts) > 1:
+            break
+        time.sleep(0.05)
+    go_on.set()
+    second = case.other.end()
+    case.judge(case.mine.end(), second)
+
+
 def cloned(case):
     """The data folder, in which an order was made, is copied onto another machine, which has other cards."""
     cards = case.folder / 'cards'
@@ -207,6 +224,7 @@ PAIRS = [
     ('one serial, one order after the other', one_serial, (('plain', 'ftp'), ('edited', 'ftp'), ('edited', 'http'))),
     ('one serial, in the middle of the first order', one_serial_in_the_middle, (('plain', 'ftp'), ('edited', 'http'))),
     ('one serial, the first folder still empty', one_serial_empty_folder, (('plain', 'ftp'), ('edited', 'http'))),
+    ('one serial, both ask before either has sent', one_serial_both_ask, (('edited', 'http'),)),
     ('a cloned data folder, other network cards', cloned, (('plain', 'ftp'), ('edited', 'http'))),
 ]
 QUICK = (one_workspace, one_serial)

@@ -34,6 +34,8 @@ QByteArray FakeWebLab::listOf(const QString& folder) const {
 
 Result<WebAnswer> FakeWebLab::fetch(const QString& url) {
     urls += url;
+    if (onFetch)
+        onFetch();
     if (strikes(deadCalls))
         return down();
     for (const auto& [part, page] : pages) {
@@ -72,8 +74,10 @@ Result<WebAnswer> FakeWebLab::post(const QString& url, const PostRequest& reques
         onPost(name);
     if (strikes(deadPosts))
         return Failure{deadConnectKind, u"nobody answers"_s};
-    if (strikes(refusals[name]))
-        return WebAnswer{"no room", 500};
+    const bool isRefused = strikes(refusals[name]);
+    const WebAnswer refusal{"no room", 500};
+    if (isRefused && halves[name] == 0)
+        return refusal;
     const QString folder = between(url, u"folder="_s, u"&"_s);
     const qsizetype from = request.body.indexOf("\r\n\r\n") + 4;
     const qsizetype end = request.body.lastIndexOf("\r\n--OLA_GRAIN--");
@@ -83,15 +87,19 @@ Result<WebAnswer> FakeWebLab::post(const QString& url, const PostRequest& reques
         uploads[folder][name] = request.body.mid(from, isCut || strikes(halves[name]) ? (end - from) / 2 : end - from);
     if (isCut || strikes(lostAnswers[name]))
         return down();
-    return WebAnswer{"stored"};
+    return isRefused ? refusal : WebAnswer{"stored"};
 }
 
 Result<std::optional<qint64>> FakeWebLab::contentLength(const QString& url) {
     urls += url;
     if (strikes(deadCalls))
         return down();
-    const QByteArray* file = tellsNoLength ? nullptr : fileAt(url);
-    return file ? std::optional<qint64>(file->size()) : std::nullopt;
+    if (tellsNoLength || (!knowsNoHead && url.contains(u"/filelist"_s)))
+        return std::optional<qint64>();
+    const QByteArray* file = knowsNoHead ? nullptr : fileAt(url);
+    if (!file)
+        return Failure{Failure::Kind::NotFound, u"404"_s};
+    return std::optional<qint64>(file->size());
 }
 
 Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {

@@ -22,8 +22,9 @@ public:
     std::map<QString, int> cuts;           // how often the line is cut in the middle of a file, which is stored
     std::map<QString, int> lostAnswers;    // how often the line is cut after the last byte of a file
     bool tellsNoLength = false;            // to HEAD
+    bool knowsNoHead = false;              // and answers it with 404
     std::optional<QByteArray> listInstead; // what each list file says
-    std::map<QString, int> refusals;       // how often a file is answered with 500 and not stored
+    std::map<QString, int> refusals;       // how often a file is answered with 500, and stored only as one of halves
     std::map<QString, WebAnswer> pages;    // what an address that holds the key is answered with instead
     bool refusesLists = false;             // no list file is given out
     std::function<void(const QString& name)> onPost;

@@ -16,13 +16,15 @@
 namespace lumora {
 
 struct HttpArrival::Asked {
-    std::optional<qint64> length;
-    bool cut = false; // by the line
+    std::optional<qint64> length = {};
+    bool cut = false;  // by the line
+    bool gone = false; // the server has no such file
 };
 
 void HttpArrival::beginOrder(const QStringList& inHand) {
     m_leftBehind = inHand;
     m_proven.clear();
+    m_knowsHead.reset();
     m_byName = false;
 }
 
@@ -30,7 +32,7 @@ void HttpArrival::postBegins(const QString& path) {
     m_proven.remove(path);
 }
 
-void HttpArrival::postCut(const QString& path) {
+void HttpArrival::postUnconfirmed(const QString& path) {
     if (m_state.Careful && !m_leftBehind.contains(path))
         m_leftBehind += path;
 }
@@ -47,24 +49,38 @@ bool HttpArrival::byNameOnly() const {
 }
 
 // A server that changes the letter case has the file under the name of its list.
-HttpArrival::Asked HttpArrival::ask(const QString& name, const Listed& there) const {
+HttpArrival::Asked HttpArrival::ask(const QString& name, const Listed& there) {
     QStringList names{name};
     for (const QString& entry : there.entries) {
         const QString listed = entry.trimmed();
         if (listed != name && listed.compare(name, Qt::CaseInsensitive) == 0)
             names += listed;
     }
+    bool gone = true;
     for (const QString& each : names) {
         m_silence.begin();
         const Result<std::optional<qint64>> told =
             m_platform.internet.contentLength(there.uploads + NameInAddress(each));
         m_platform.pump.pump();
-        if (!told)
-            return {{}, true};
-        if (*told)
-            return {*told, false};
+        const bool missing = !told && told.failure().kind == Failure::Kind::NotFound;
+        if (!told && !missing)
+            return {.cut = true};
+        if (told && *told)
+            return {.length = *told};
+        gone = gone && missing;
     }
-    return {};
+    return {.gone = gone && knowsHead(there)};
+}
+
+// Some servers answer each HEAD with 404, also for the list that has just been read.
+bool HttpArrival::knowsHead(const Listed& there) {
+    for (int number = 0; !m_knowsHead.value_or(false) && !ListFileName(number).isEmpty(); ++number) {
+        const Result<std::optional<qint64>> told =
+            m_platform.internet.contentLength(there.uploads + ListFileName(number));
+        m_platform.pump.pump();
+        m_knowsHead = told || told.failure().kind != Failure::Kind::NotFound;
+    }
+    return *m_knowsHead;
 }
 
 QStringList HttpArrival::remains(const QStringList& paths, const Listed& there) {
@@ -89,7 +105,7 @@ QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there)
         return {};
     QList<LocalFile> here;
     QList<RemoteFile> told;
-    QStringList cut;
+    QStringList left; // the asking was cut, or the server has no such file
     m_byName = false;
     int unanswered = 0;
     int cuts = 0;
@@ -101,10 +117,10 @@ QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there)
             continue;
         const bool stopped = m_stop.left || m_stop.StopFlag;
         const bool asks = unanswered < most && cuts < most && !stopped;
-        const Asked asked = asks ? ask(LeafName(path), there) : Asked{{}, cuts > 0 || stopped};
-        if (asked.cut) {
-            ++cuts;
-            cut += path;
+        const Asked asked = asks ? ask(LeafName(path), there) : Asked{.cut = cuts > 0 || stopped};
+        if (asked.cut || asked.gone) {
+            cuts += asked.cut ? 1 : 0;
+            left += path;
             continue;
         }
         unanswered = asked.length ? 0 : unanswered + 1;
@@ -115,7 +131,6 @@ QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there)
     }
     const ArrivalProof proof = ArrivalProof::of(here, told, ArrivalProof::Names::WithoutCase);
     m_byName = !proof.byName.isEmpty();
-    QStringList left = cut;
     for (const QString& path : paths) {
         if (proof.broken.contains(LeafName(path)))
             left += path;

@@ -31,8 +31,8 @@ public:
     // Around each post. A file that is posted again is no longer proven by an earlier check.
     void postBegins(const QString& path);
     void postConfirmed(const QString& path) { m_leftBehind.removeAll(path); }
-    // As built in, a list that names the file confirms it.
-    void postCut(const QString& path);
+    // The post was cut, or answered outside 200 to 299. As built in, a list that names the file confirms it.
+    void postUnconfirmed(const QString& path);
     bool isLeftBehind(const QString& path) const { return m_leftBehind.contains(path); }
 
     // What the list tells of the order's folder: its entries, and the folder's address with its last slash.
@@ -53,14 +53,16 @@ public:
 
 private:
     struct Asked;
-    Asked ask(const QString& name, const Listed& there) const;
+    Asked ask(const QString& name, const Listed& there);
+    bool knowsHead(const Listed& there);
 
     const SessionState& m_state;
     const Platform& m_platform;
     const SendingStop& m_stop;
     SilenceLimit& m_silence;
     QStringList m_leftBehind;
-    QMap<QString, qint64> m_proven; // lengths by path
+    QMap<QString, qint64> m_proven;  // lengths by path
+    std::optional<bool> m_knowsHead; // once it was asked for
     bool m_byName = false;
 };
 

@@ -1,6 +1,7 @@
 #include "transfer/http/HttpFolderOwner.h"
 
 #include "order/OrderJournal.h"
+#include "order/OrderNames.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
@@ -10,6 +11,25 @@
 #include <algorithm>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int notAllowed = 401; // of a web server's answer
+constexpr int forbidden = 403;
+
+bool isSame(const QString& name, const QString& other) {
+    return name.compare(other, Qt::CaseInsensitive) == 0;
+}
+
+// Names that only an order brings, other than files of the server's own making.
+bool isPrintOrSheet(const QString& name) {
+    return IsSheet(name) || name.endsWith(u".jpp"_s, Qt::CaseInsensitive) ||
+           name.endsWith(u".prk"_s, Qt::CaseInsensitive);
+}
+
+} // namespace
 
 bool HttpFolderOwner::claims() const {
     return m_state.Careful;
@@ -21,18 +41,58 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
         return Owner::Ours;
     if (!answer.files)
         return Owner::NotKnown;
+    // This order has posted its log and nothing else.
+    const bool posted = order.state().makesFolder;
     if (answer.files->isEmpty())
-        return Owner::Ours;
-    const QString log = order.folder().logPath().leaf();
-    const auto found = std::find_if(answer.files->begin(), answer.files->end(),
-                                    [&](const QString& name) { return name.compare(log, Qt::CaseInsensitive) == 0; });
-    const Result<QByteArray> ours = m_platform.files.read(order.folder().logPath());
-    if (found == answer.files->end() || !ours)
+        return Owner::Unclaimed;
+    if (posted && std::any_of(answer.files->begin(), answer.files->end(), isPrintOrSheet))
         return Owner::Foreign;
-    const Result<WebAnswer> theirs = m_platform.internet.fetch(uploads + NameInAddress(*found));
-    if (!theirs || !theirs->good())
+    const QString log = order.folder().logPath().leaf();
+    if (std::none_of(answer.files->begin(), answer.files->end(),
+                     [&](const QString& name) { return isSame(name, log); }))
+        return posted ? Owner::Unclaimed : Owner::Foreign;
+    switch (logThere(order, *answer.files, uploads)) {
+    case Log::Same:
+        return Owner::Ours;
+    case Log::Part:
+        return posted ? Owner::Unclaimed : Owner::Foreign;
+    case Log::Withheld:
+        return posted ? Owner::Ours : Owner::NotKnown;
+    case Log::NotKnown:
         return Owner::NotKnown;
-    return theirs->body == *ours ? Owner::Ours : Owner::Foreign;
+    case Log::Other:
+        break;
+    }
+    return Owner::Foreign;
+}
+
+bool HttpFolderOwner::isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const {
+    return m_state.Careful && m_platform.files.fileExists(order.folder().logPath()) &&
+           logThere(order, entries, uploads) == Log::Other;
+}
+
+// A server that changes the letter case may give a file out under the name of its list alone.
+HttpFolderOwner::Log HttpFolderOwner::logThere(const OrderJournal& order, const QStringList& entries,
+                                               const QString& uploads) const {
+    const DrivePath path = order.folder().logPath();
+    const Result<QByteArray> ours = m_platform.files.read(path);
+    if (!ours)
+        return Log::Other;
+    QStringList names{path.leaf()};
+    for (const QString& entry : entries) {
+        if (entry.trimmed() != names.first() && isSame(entry.trimmed(), names.first()))
+            names += entry.trimmed();
+    }
+    for (const QString& name : names) {
+        const Result<WebAnswer> theirs = m_platform.internet.fetch(uploads + NameInAddress(name));
+        if (!theirs)
+            return Log::NotKnown;
+        if (theirs->good())
+            return theirs->body == *ours ? Log::Same : ours->startsWith(theirs->body) ? Log::Part : Log::Other;
+        if (theirs->status == notAllowed || theirs->status == forbidden)
+            return Log::Withheld;
+    }
+    return Log::NotKnown;
 }
 
 } // namespace lumora

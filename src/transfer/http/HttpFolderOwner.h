@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 namespace lumora {
 
@@ -14,9 +15,10 @@ struct SessionState;
 class HttpFolderOwner {
 public:
     enum class Owner {
-        Ours,     // posted into by this order, or not there, or without a file, or with this order's log in it
-        Foreign,  // the log there differs by a byte at least, or there is none
-        NotKnown, // the list could not be read, the log was not given out, or the line was cut
+        Ours,      // claimed by this order, or with this order's log in it
+        Unclaimed, // not there, or without a file, or with a part of the log that this order has posted
+        Foreign,   // the log there differs by a byte at least, or there is none
+        NotKnown,  // the list could not be read, the log was not given out, or the line was cut
     };
 
     HttpFolderOwner(const SessionState& state, const Platform& platform)
@@ -25,10 +27,17 @@ public:
 
     // answer: of the server about the order's folder. uploads: the folder's address, with its last slash.
     Owner of(const OrderJournal& order, const ServerAnswer& answer, const QString& uploads) const;
-    // True where a first post makes the folder known as the order's own; as built in never.
+    // True where the folder has to be claimed: no server makes a folder for one order alone, so that two orders that
+    // found none would post into one. The log goes first, and nothing else until the server gives out this very log
+    // from a folder without another order's files. As built in never.
     bool claims() const;
+    // Another order's log has taken the place of this order's since; as built in never.
+    bool isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
 
 private:
+    enum class Log { Same, Part, Other, Withheld, NotKnown };
+    Log logThere(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
+
     const SessionState& m_state;
     const Platform& m_platform;
 };

@@ -4,6 +4,7 @@
 #include "common/DrivePath.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
+#include "order/OrderNames.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -13,6 +14,8 @@
 #include "transfer/delivery/OrderFiles.h"
 #include "transfer/delivery/StoppableLine.h"
 #include "transfer/report/InetForm.h"
+
+#include <utility>
 
 namespace lumora {
 
@@ -25,7 +28,13 @@ constexpr int httpPauseRounds = 1801;
 constexpr qint64 largestList = 4 * 1024 * 1024;
 // Numbers that the server is asked for until one is free.
 constexpr int mostNames = 50;
+// Posts of the log in one attempt, until the server gives it out.
+constexpr int mostClaims = 2;
 const QString testFolder = u"tttt"_s;
+
+bool isTimeOut(const Failure& failure) {
+    return failure.kind == Failure::Kind::TimedOut;
+}
 
 } // namespace
 
@@ -163,11 +172,16 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
     if (m_owner == Owner::NotKnown || !isEntered())
         compare(m_listNumber);
     // Another attempt could not post either, and would wait as long.
-    if (m_owner == Owner::NotKnown && m_listFailure.kind == Failure::Kind::TimedOut && !stop.StopFlag)
+    if (m_owner == Owner::NotKnown && isTimeOut(m_listFailure) && !stop.StopFlag)
         endSilent();
+    const bool claims = m_owner == Owner::Unclaimed && !stopped();
+    if (claims)
+        claimFolder();
     if (m_owner != Owner::Ours || stopped())
         return m_owner == Owner::Foreign ? SendingPhase::NumberTaken : endEarly();
-    const QStringList files = lists.List4Hossarim.items();
+    QStringList files = lists.List4Hossarim.items();
+    if (claims)
+        files.removeAll(logPath());
     m_silence.begin();
     m_left = static_cast<int>(files.size());
     for (int i = 0; i < files.size(); ++i) {
@@ -192,6 +206,44 @@ bool HttpSender::isEntered() const {
     return !m_folderOwner.claims() || (m_journal && m_journal->state().folderMadeByUs);
 }
 
+QString HttpSender::logPath() const {
+    return OrderFolder(m_state.transfer.OrderFolder).logPath().text();
+}
+
+// An order without its log can't tell its folder from another's.
+void HttpSender::claimFolder() {
+    const QString log = logPath();
+    if (!lists.List4Kvazim.contains(log)) {
+        m_owner = Owner::Ours;
+        return;
+    }
+    bool timedOut = false;
+    for (int tries = 0; tries < mostClaims && m_owner == Owner::Unclaimed && !stopped(); ++tries) {
+        m_events.sending(0, lists.List4Hossarim.count(), LeafName(log));
+        HttpPause();
+        if (stopped())
+            return;
+        keep(m_journal->folderIsAsked());
+        m_silence.begin();
+        m_left = lists.List4Hossarim.count();
+        m_allPosted = true;
+        post(log);
+        const bool before = std::exchange(timedOut, m_script.failed() && isTimeOut(m_script.lastFailure()));
+        if (before && timedOut && !stopped())
+            endSilent();
+        if (!stopped())
+            compare(m_listNumber);
+    }
+    // The log is not there: without it nothing else may go.
+    if (m_owner == Owner::Unclaimed)
+        m_owner = Owner::NotKnown;
+}
+
+// The other order has posted its log after this one's was found there.
+bool HttpSender::isClaimedByAnother() const {
+    return m_journal && m_folderOwner.isReplaced(*m_journal, lists.ListAfterWeb.items(), uploadsAddress());
+}
+
 void HttpSender::post(const QString& path) {
     const DrivePath folder = DrivePath(path).folder();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
@@ -200,15 +252,15 @@ void HttpSender::post(const QString& path) {
     m_arrival.postBegins(path);
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     const bool cut = m_script.failed() && !m_script.failedBeforeSending();
-    // A file that was refused stays in hand; whether it has arrived is for the list to tell.
+    // A file that was refused stays in hand; whether it has arrived is for the list and HEAD to tell.
     const bool unconfirmed = cut || m_script.refused();
-    if (cut)
-        m_arrival.postCut(path);
-    else if (!m_script.failed() && !unconfirmed)
+    if (unconfirmed)
+        m_arrival.postUnconfirmed(path);
+    else if (!m_script.failed())
         m_arrival.postConfirmed(path);
     if (m_journal && !unconfirmed && !m_arrival.isLeftBehind(path))
         keep(m_journal->release(path));
-    m_silence.connectsTimedOut(cut && m_script.lastFailure().kind == Failure::Kind::TimedOut);
+    m_silence.connectsTimedOut(cut && isTimeOut(m_script.lastFailure()));
     m_events.reached(SendingMoment::Answered);
     if (!m_script.failed()) {
         m_events.reached(SendingMoment::Posted, --m_left);
@@ -229,6 +281,12 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
         if (m_listGuard.asksAgain(m_verdict) && !stopped())
             compare(HttpListGuard::first);
         m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
+    }
+    // The other order may have come later.
+    if (posted && m_verdict == ServerVerdict::Listed && !stopped() && isClaimedByAnother()) {
+        keep(m_journal->folderIsLost());
+        m_events.failed(LineStep::ForeignFolder, {Failure::Kind::InUse, folderName()});
+        return SendingPhase::CallLab;
     }
     const bool all = posted && lists.List4Hossarim.isEmpty();
     const std::optional<SendingPhase> early = all ? std::nullopt : endEarly();

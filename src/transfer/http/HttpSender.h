@@ -111,6 +111,8 @@ private:
 
     void compare(int listNumber);
     bool isEntered() const; // the folder needs no further question whose it is
+    void claimFolder();
+    bool isClaimedByAnother() const;
     bool stopped() const { return m_stop.left || m_stop.StopFlag; }
     void endSilent();
     std::optional<SendingPhase> endEarly();
@@ -120,6 +122,7 @@ private:
     void tellMissing();
     LineStep listTrouble() const;
     QString folderName() const;
+    QString logPath() const;
     QString siteAddress(const QString& rest) const;
     QString uploadsAddress() const; // of the order's folder
     QString listScript(const QString& folder) const;

@@ -1,6 +1,5 @@
 #include "platform/line/PocoInternet.h"
 #include "support/LabServers.h"
-#include "support/TcpRelay.h"
 #include "support/UploadFormRig.h"
 
 #include <gtest/gtest.h>
@@ -56,15 +55,6 @@ TEST_F(SendByHttp, ASecondKindOfServerTakesTheSameRequest) {
     rig.state.profile.HttpHost = second.site();
     rig.send();
     expectArrived(second.uploads());
-}
-
-TEST_F(SendByHttp, WhatWasCutInItsMiddleGoesAgain) {
-    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
-    rig.state.profile.HttpHost = u"http://"_s + relay.host();
-    rig.start();
-    relay.setFaults({.cutDataAfter = 20, .times = 2});
-    rig.countDown();
-    expectArrived(lab.uploads());
 }
 
 TEST_F(SendByHttp, AListThatCanNotBeKeptIsToldAsATroubleOfThisComputer) {
