@@ -72,10 +72,10 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
         return !state.items.isEmpty();
     if (state.phase == Phase::Reported || !canBeSent(session, state))
         return false;
-    if (state.phase == Phase::Arrived)
-        return state.report == OrderState::Report::NotYet && !state.sentBefore;
-    if (state.fewerAgreed || state.sentBefore)
+    if (state.sentBefore)
         return false;
+    if (state.phase == Phase::Arrived || state.fewerAgreed)
+        return state.report == OrderState::Report::NotYet;
     const QStringList names = files.names(order.folder.path(), u"*"_s);
     return OrderCompleteness::read(files, order.folder, names).verdict() != OrderCompleteness::Verdict::None;
 }

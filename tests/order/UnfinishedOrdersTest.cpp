@@ -119,7 +119,7 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         {Phase::Prepared, Way::Ftp, Report::NotYet, false, false}, // its print files were cleaned away
         {Phase::Sending, Way::Mail, Report::NotYet, true, false},
         {Phase::Sending, Way::Ftp, Report::NotYet, true, true},
-        {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::fewerAgreed},
+        {Phase::Sending, Way::Ftp, Report::NotYet, false, true, &OrderState::fewerAgreed}, // the lab is to be told
         {Phase::Sending, Way::Ftp, Report::NotYet, true, false, &OrderState::sentBefore},
         {Phase::Arrived, Way::Http, Report::NotYet, false, true}, // the lab alone is to be told
         {Phase::Arrived, Way::Http, Report::NotYet, true, false, &OrderState::sentBefore}, // the lab may have been told

@@ -2,6 +2,7 @@
 #include "support/FakeLab.h"
 #include "support/RecordedSending.h"
 #include "support/TestPlatform.h"
+#include "transfer/delivery/StoppableLine.h"
 
 #include <gtest/gtest.h>
 
@@ -172,8 +173,6 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
     } cases[] = {
         {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, Success, 1, 3},
         {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, NotAll, 4, 3},
-        {"login refused", [](Line& line) { line.lab.refusedLogins = FakeLab::always; }, NotAll, 4, 0},
-        {"put refused once", puts({u"01a.jpp"_s, 1, -1}), Success, 2, 4},
         // The 60 tries end within the third attempt.
         {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
@@ -270,6 +269,22 @@ TEST_F(FtpSenderTest, ARecheckThatDoesNotReachTheFolderSaysSo) {
     lab.folders.erase(base);
     sender.check.RecheckBroken();
     EXPECT_EQ(told.count(OutsideFolder), 1);
+}
+
+TEST_F(FtpSenderTest, WhatAnEarlierSendingBrokeStaysInHandWhereThisOneIsOfOtherFiles) {
+    const QByteArray first = path(names()[1]).text().toLatin1();
+    const QByteArray second = path(names()[2]).text().toLatin1();
+    ASSERT_TRUE(test.files.writeWhole(folder / u"kashloo.txt", first + "\r\n" + second + "\r\n"));
+    order({names()[0], names()[2]});
+    EXPECT_EQ(lists.List4Broken.items(), QStringList(QString::fromLatin1(second)));
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
+    EXPECT_EQ(session.journal()->state().filesInHand, QStringList(QString::fromLatin1(first)));
+}
+
+TEST_F(FtpSenderTest, ACallInsideACallLeavesTheOuterOneStoppable) {
+    const StoppableLine outer(test.platform);
+    { const StoppableLine inner(test.platform); }
+    EXPECT_EQ(lab.pump, &test.pump);
 }
 
 TEST_F(FtpSenderTest, TheOlderBulkPathSendsInRounds) {

@@ -1,3 +1,4 @@
+#include "order/OrderJournal.h"
 #include "support/FakeLab.h"
 #include "support/FtpFrmRig.h"
 
@@ -21,14 +22,12 @@ struct Area {
         rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::first()});
         rig.start().Command23_Click();
     }
-    void cannotPut(int cutAfter) {
-        lab.putFaults = {{FtpFrmRig::first(), FakeLab::always, cutAfter}};
+    void leavesRemains() {
+        lab.putFaults = {{FtpFrmRig::first(), FakeLab::always, 60}};
         lab.refusesDelete = true;
         sends();
         lab.putFaults.clear();
     }
-    void isRefusedAFile() { cannotPut(-1); }
-    void leavesRemains() { cannotPut(60); }
     void hasANameTwice() { rig.takeUpAgain(QStringList(2, FtpFrmRig::first())), sends(); }
     void isStopped() {
         lab.onPut = [&](const QString&) { page().Command15_Click(); };
@@ -76,7 +75,6 @@ TEST(LabArea, EachButtonIsSafeInEachPhase) {
          {{{NoOrder, 0, 0, 0}, {NoOrder, 0, 0, 0}, {NoOrder, 0, 0, 1}, {NoOrder, 0, 0, 1}}}},
         {&Area::counts, Countdown, {{lists, lists, {Countdown, 5, 0, 1}, {Success, 5, 5, 0}}}},
         {&Area::waitsWithAPart, Waiting, {{lists, {Countdown, 3, 0, 0}, {Success, 3, 3, 0}, {Success, 3, 3, 0}}}},
-        {&Area::isRefusedAFile, NotAll, {{lists, lists, {NotAll, 1, 0, 1}, {Success, 1, 1, 0}}}},
         {&Area::leavesRemains, NotAll, {{lists, lists, {NotAll, 1, 0, 1}, {Success, 1, 1, 0}}}},
         {&Area::hasANameTwice, Unclear, {{lists, {Countdown, 3, 0, 0}, {NotAll, 3, 0, 0}, {Unclear, 0, 0, 1}}}},
         {&Area::isStopped, Stopped, {{lists, lists, {Stopped, 5, 0, 1}, {Success, 5, 5, 0}}}},
@@ -155,6 +153,9 @@ TEST(LabArea, NothingStartsBeforeTheOrderIsListedOrDuringASending) {
 
 TEST(LabArea, AConnectionByHandHoldsTheCountAndEndsBeforeASending) {
     Area area;
+    OrderJournal order(area.rig.test.files, OrderFolder(FtpFrmRig::folder()));
+    ASSERT_TRUE(order.reportBegun());
+    const auto inHand = [&] { return ReadOrderState(area.rig.test.files, order.folder())->filesInHand.size(); };
     FtpFrm& page = area.rig.start();
     page.Command3_Click();
     EXPECT_EQ(area.rig.test.dialogs.messages.last(), u"Not in session"_s);
@@ -165,9 +166,13 @@ TEST(LabArea, AConnectionByHandHoldsTheCountAndEndsBeforeASending) {
     area.lab.onPut = [&](const QString&) {
         page.Image5_Click(); // the connection is in use
         page.cmdClosehOpen_Click();
+        page.Command4Dooach_Click();
         EXPECT_EQ(page.phase(), SendingPhase::Waiting);
+        EXPECT_EQ(inHand(), 1);
     };
     page.Command3_Click();
+    EXPECT_TRUE(area.lab.urls.isEmpty() && page.mayReportAgain());
+    EXPECT_EQ(inHand(), 0);
     area.lab.onPut = {};
     page.List2_Click(page.lists().List2.find(FtpFrmRig::first()));
     area.rig.write(FtpFrmRig::first(), "lost");

@@ -3,12 +3,12 @@
 #include "order/CompletenessGuard.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
+#include "order/OrderNames.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "transfer/delivery/OrderFiles.h"
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"
 #include "transfer/report/ReportOnce.h"
@@ -80,6 +80,12 @@ QString SendingPage::wording(const char16_t* hebrew, const char16_t* english) co
 }
 
 QString SendingPage::advice(const PhaseLook& row) const {
+    if (m_lacking && row.phase == SendingPhase::Reporting)
+        return wording(fewerReportingWords);
+    if (m_lacking && row.phase == SendingPhase::AllThere)
+        return wording(report().wasTold() ? fewerToldWords : fewerUntoldWords)
+            .arg(m_lacking->sent())
+            .arg(m_lacking->named.value_or(0));
     return wording(row.advice);
 }
 
@@ -176,7 +182,7 @@ void SendingPage::tellWatched(Telling telling, ReportCalls& calls) {
 }
 
 bool SendingPage::mayReportAgain() const {
-    return report().mayTellAgain() && !isUnderWay(m_phase) && m_phase != SendingPhase::Preparing;
+    return report().mayTellAgain() && !lineInUse() && !isUnderWay(m_phase) && m_phase != SendingPhase::Preparing;
 }
 
 bool SendingPage::reportUnknown() const {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/OrderCompleteness.h"
 #include "session/Page.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/Countdown.h"
@@ -71,10 +72,14 @@ protected:
     virtual LabReport& report() = 0;
     virtual const LabReport& report() const = 0;
     virtual ReportCalls* reportCalls() = 0;
+    // A call on the line is under way, also one that the phase does not show.
+    virtual bool lineInUse() const = 0;
 
     void enter(SendingPhase phase);
     // Shows the texts of the phase in the language of the session.
     void tellPhase();
+    // Shows what the operator may do about the report.
+    void showReporting();
     void tellReason(LineStep step, const Failure& failure, const QString& subject);
     void forgetReason();
     // A step of the sending could not be kept in the order's folder.
@@ -96,6 +101,7 @@ protected:
     const Platform& m_platform;
     PageChain& m_chain;
     Countdown m_countdown;
+    std::optional<OrderCompleteness> m_lacking; // of an order that has arrived with fewer prints than its log names
 
 private:
     QString adviceOf(const PhaseLook& row) const;
@@ -105,7 +111,6 @@ private:
     void activate();
     void reportAgain();
     void watchReport();
-    void showReporting();
     using Telling = void (LabReport::*)(ReportCalls&);
     void tellWatched(Telling telling, ReportCalls& calls);
 

@@ -17,7 +17,7 @@ enum class SendingPhase {
     Checking,  // the server is asked which files have arrived
     Reporting, // all files have arrived; the lab's site is told
     Success,
-    AllThere,    // all files are on the server; no report was sent
+    AllThere,    // all files are on the server; a report was sent only where fewer pictures were agreed to
     Unclear,     // the server's list gives no clear answer
     NotAll,      // files are missing after the last attempt
     Stopped,     // the customer has stopped the sending

@@ -48,4 +48,14 @@ inline constexpr SendingWords reportUnknownWords{
     u"The report to the lab was begun, and it is not known whether it was heard."};
 inline constexpr SendingWords reportAgainWords{u"דווח שוב", u"Report again"};
 
+inline constexpr SendingWords fewerReportingWords{u"ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",
+                                                  u"Your order has arrived. Telling the shop, please wait."};
+// %1: prints that have arrived, %2: prints that the order's log names.
+inline constexpr SendingWords fewerToldWords{
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרת, והמעבדה קיבלה על כך הודעה.",
+    u"%1 of the %2 pictures in the order's log have arrived, as you agreed, and the lab was told."};
+inline constexpr SendingWords fewerUntoldWords{
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",
+    u"%1 of the %2 pictures in the order's log have arrived, and the lab was not told. Please call the lab."};
+
 } // namespace lumora

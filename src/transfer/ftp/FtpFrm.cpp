@@ -193,16 +193,20 @@ void FtpFrm::showFailure() {
 }
 
 // A stop that came too late for the sending is none of the telling.
-void FtpFrm::succeed() {
+void FtpFrm::tellOfArrival() {
     m_sender.stop.StopFlag = false;
     enter(SendingPhase::Reporting);
-    for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
-        control->visible = false;
-    File1Enabled.enabled = false;
     status(wording(u" מיד מסיימים ", u" Finishing at once "));
     captionFollowsStatus();
     m_platform.pump.pump();
     tellLab();
+}
+
+void FtpFrm::succeed() {
+    for (Caption* control : {&Frame9, &Picture1, &Label2, &Label6, &Label7, &Label8, &Image10, &Image11, &Frame5})
+        control->visible = false;
+    File1Enabled.enabled = false;
+    tellOfArrival();
     if (m_sender.stop.left)
         return;
     forgetReason();
@@ -223,8 +227,13 @@ void FtpFrm::finish(SendingPhase end) {
 }
 
 void FtpFrm::showEnd(SendingPhase end) {
+    m_lacking.reset();
+    if (end == SendingPhase::AllThere && m_sender.report.isAsAgreed())
+        m_lacking = m_sender.completeness();
     if (end == SendingPhase::Success)
         succeed();
+    else if (end == SendingPhase::AllThere && m_sender.report.isDueAsAgreed())
+        tellOfArrival();
     if (m_sender.stop.left)
         return;
     pageSize = PageSize::Full;

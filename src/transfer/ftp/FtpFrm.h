@@ -96,6 +96,7 @@ private:
     LabReport& report() override { return m_sender.report; }
     const LabReport& report() const override { return m_sender.report; }
     ReportCalls* reportCalls() override;
+    bool lineInUse() const override { return busy(); }
     void showSeconds();
     void showSecondsAfterFailure();
     void sendOrder();
@@ -113,6 +114,7 @@ private:
     void finish(SendingPhase end);
     void showEnd(SendingPhase end);
     void succeed();
+    void tellOfArrival();
     void showFailure();
     void showProof();
     void FtpEnableControls(bool enable);

@@ -7,6 +7,8 @@
 #include "transfer/delivery/StoppableLine.h"
 #include "transfer/ftp/FtpFrm.h"
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -142,10 +144,11 @@ void FtpFrm::checkChosenOrder() {
         return;
     holdCount();
     const SendingPhase before = phase();
-    m_state.transfer.ShemTikiya = lists().ListRezefFiles.currentItem();
+    const QString own = std::exchange(m_state.transfer.ShemTikiya, lists().ListRezefFiles.currentItem());
     m_sender.stop.StopFlag = false;
     enter(SendingPhase::Checking);
     listOnServer();
+    m_state.transfer.ShemTikiya = own;
     enter(before);
 }
 
@@ -168,6 +171,7 @@ void FtpFrm::showLabButtons() {
     for (Caption* manual : {&cmdInternetOpen, &cmdClosehOpen, &Command3, &Command5, &Command6, &Command7})
         manual->enabled = mayAct();
     chkPassive.enabled = optBin.enabled = optAscii.enabled = mayAct() && cmdClosehOpen.visible;
+    showReporting();
     Q_EMIT changed();
 }
 

@@ -123,7 +123,7 @@ void FtpFrm::armCountdown() {
     // The lab may have taken its files away since.
     if (!lists().List3.isEmpty() && m_sender.onlyReportIsLeft()) {
         m_sender.beginOrder();
-        showEnd(SendingPhase::Success);
+        showEnd(m_sender.report.endWhereLeft());
         return;
     }
     if (lists().List3.isEmpty() || !mayBeSent()) {

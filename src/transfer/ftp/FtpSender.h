@@ -47,6 +47,8 @@ public:
     Verdict verdict() const;
     // What has arrived where the sending ends so.
     Arrival arrival(SendingPhase end) const;
+    // The prints of the order and of what is sent.
+    OrderCompleteness completeness() const { return check.completeness(); }
     bool provenByNameOnly() const { return !check.proof || check.proof->provenByNameOnly(); }
     // The end when nothing is left to send but the counts differ.
     SendingPhase silentEnd() const;

@@ -535,7 +535,14 @@ void FtpSession::listHereAgain() {
 
 void FtpSession::putHere(const DrivePath& path) {
     const auto local = m_platform.files.drives().toHost(path);
+    const bool ofOrder = m_journal && path.folder() == m_journal->folder().path();
+    // A file that was in hand before stays so: the hand may put it into another folder.
+    const bool takes = ofOrder && !m_journal->state().filesInHand.contains(path.text());
+    if (takes)
+        keep(m_journal->take(path.text()));
     const auto sent = local && hConnection ? hConnection->put(*local, path.leaf()) : Result<void>(noLine());
+    if (takes && sent)
+        keep(m_journal->release(path.text()));
     if (!sent)
         FtpFatalError(sent.failure(), u"FtpPutFile"_s);
     else

@@ -206,9 +206,11 @@ Arrival UploadCheck::orderThere() {
 Arrival UploadCheck::arrivalByNames() const {
     if (!restOfOrder().isEmpty())
         return Arrival::Part;
-    return arrivalBy(
-        OrderCompleteness::read(m_files, OrderFolder(m_transfer.OrderFolder), LeafNames(m_lists.List4Makor.items()))
-            .verdict());
+    return arrivalBy(completeness().verdict());
+}
+
+OrderCompleteness UploadCheck::completeness() const {
+    return OrderCompleteness::read(m_files, OrderFolder(m_transfer.OrderFolder), LeafNames(m_lists.List4Makor.items()));
 }
 
 Arrival UploadCheck::arrivalBy(OrderCompleteness::Verdict verdict) {

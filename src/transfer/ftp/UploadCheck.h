@@ -48,6 +48,8 @@ public:
     std::optional<ArrivalProof> proof;
     // With the proof: how much of the order lies there, also where the sending is only a part of it.
     Arrival proven = Arrival::Part;
+    // The prints of the order's log and those among the files of the sending.
+    OrderCompleteness completeness() const;
     // How much has arrived where the files of the sending have, each by its name alone.
     Arrival arrivalByNames() const;
 

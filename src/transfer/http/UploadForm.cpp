@@ -76,7 +76,10 @@ void UploadForm::refreshList() {
     m_sender.stop.StopFlag = false;
     // The lab may have taken its files away since.
     if (m_sender.onlyReportIsLeft()) {
-        succeed();
+        if (m_sender.report.endWhereLeft() == SendingPhase::Success)
+            succeed();
+        else
+            endAllThere();
         return;
     }
     m_busy = true;
@@ -244,25 +247,32 @@ void UploadForm::endAllThere() {
     m_attemptFailed = false;
     m_lacking = m_sender.lacking();
     forgetReason();
+    if (m_sender.report.isDueAsAgreed() && !tellOfArrival())
+        return;
     Picture1.visible = true;
     enter(SendingPhase::AllThere);
 }
 
-// A stop that came too late for the sending is none of the telling.
-void UploadForm::succeed() {
+// A stop that came too late for the sending is none of the telling. False where the customer has left.
+bool UploadForm::tellOfArrival() {
     m_sender.stop.StopFlag = false;
     percent = 100;
     Label7.text = u"100"_s;
     caption = u"100%"_s;
     PicSargel1Width = PicSargel2Width;
-    Label1.text.clear();
-    m_attemptFailed = false;
-    forgetReason();
     enter(SendingPhase::Reporting);
     m_sender.HttpPause(2);
     if (!m_sender.stop.left)
         tellLab();
-    if (m_sender.stop.left)
+    return !m_sender.stop.left;
+}
+
+void UploadForm::succeed() {
+    Label1.text.clear();
+    m_attemptFailed = false;
+    m_lacking.reset();
+    forgetReason();
+    if (!tellOfArrival())
         return;
     Label9.visible = Pic4Hamten.visible = Picture1.visible = false;
     Picture6.visible = true;

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "order/OrderCompleteness.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/SendingPage.h"
 #include "transfer/http/HttpSender.h"
@@ -61,6 +60,7 @@ private:
     LabReport& report() override { return m_sender.report; }
     const LabReport& report() const override { return m_sender.report; }
     ReportCalls* reportCalls() override { return &m_sender; }
+    bool lineInUse() const override { return m_busy; }
     void startPanel();
     void refreshList();
     void findMissing();
@@ -70,6 +70,7 @@ private:
     void goOn();
     void sendAgain();
     void sendMissing();
+    bool tellOfArrival();
     void succeed();
     void endAllThere();
     void endIncomplete(SendingPhase end);
@@ -78,7 +79,6 @@ private:
 
     // UploadFormTexts.cpp
     std::span<const PhaseLook> looks() const override;
-    QString advice(const PhaseLook& row) const override;
     void showPhase(const PhaseLook& row) override;
     void showCount();
     void showTrouble();
@@ -113,11 +113,10 @@ private:
     Ticker Timer2;     // 1000 ms: the countdown
     Ticker Timer4Line; // 1000 ms: the watch over the line
     HttpSender m_sender;
-    bool m_busy = false;                        // a check outside an attempt runs
-    bool m_attemptFailed = false;               // an attempt of this sending has left files behind
-    std::optional<int> m_left;                  // files that have not arrived, once they are counted
-    std::optional<OrderCompleteness> m_lacking; // of an order that has arrived with fewer prints than its log names
-    QString m_orderName;                        // as the server was asked for it
+    bool m_busy = false;          // a check outside an attempt runs
+    bool m_attemptFailed = false; // an attempt of this sending has left files behind
+    std::optional<int> m_left;    // files that have not arrived, once they are counted
+    QString m_orderName;          // as the server was asked for it
 };
 
 } // namespace lumora

@@ -34,6 +34,7 @@ void UploadForm::showLabArea(bool shown) {
 void UploadForm::showLabButtons() {
     for (Caption* test : {&Command1, &Command5, &Command6, &Command7, &Command8})
         test->enabled = idle() && phase() != SendingPhase::Preparing;
+    showReporting();
     Q_EMIT changed();
 }
 

@@ -18,9 +18,6 @@ constexpr SendingWords startsIn{u" המשלוח יחל בעוד ", u"The sending
 constexpr SendingWords secondsWord{u"שניות", u"seconds"};
 constexpr SendingWords stoppedTitle{u"המשלוח נעצר", u"The sending is stopped"};
 // %1: prints among the files, %2: prints that the log names.
-constexpr SendingWords fewerArrived{
-    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",
-    u"%1 of the %2 pictures in the order's log have arrived, and the lab was not told. Please call the lab."};
 constexpr SendingWords threeAttempts{u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
                                      u"After three attempts the computer could not upload the whole order"};
 constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "};
@@ -88,12 +85,6 @@ std::span<const PhaseLook> UploadForm::looks() const {
                    u"The order is kept on this computer. Wait a little, then press Send again."}},
     };
     return rows;
-}
-
-QString UploadForm::advice(const PhaseLook& row) const {
-    if (row.phase == SendingPhase::AllThere && m_lacking)
-        return wording(fewerArrived).arg(m_lacking->sent()).arg(m_lacking->named.value_or(0));
-    return wording(row.advice);
 }
 
 void UploadForm::showPhase(const PhaseLook& row) {

@@ -30,11 +30,9 @@ LabReport::LabReport(const SessionState& state, const Platform& platform, Sendin
 void LabReport::keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly) {
     if (!m_order || !hasArrived(end))
         return;
-    if (arrival == Arrival::Agreed)
-        m_keep(m_order->arrivedAsAgreed());
-    if (arrival != Arrival::Whole)
+    if (arrival == Arrival::Part)
         return;
-    m_keep(m_order->arrived(byNameOnly));
+    m_keep(arrival == Arrival::Agreed ? m_order->arrivedAsAgreed() : m_order->arrived(byNameOnly));
     if (end != SendingPhase::AllThere)
         return;
     ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
@@ -46,8 +44,20 @@ bool LabReport::isDueWhereFound() const {
     return m_order && ReportOnce(m_state, m_platform.files, *m_order, m_stop).isDueWhereFound(m_by);
 }
 
+bool LabReport::isAsAgreed() const {
+    return m_order && m_order->state().fewerAgreed;
+}
+
+bool LabReport::isDueAsAgreed() const {
+    return isAsAgreed() && isDueWhereFound();
+}
+
 bool LabReport::isLeft(const OrderState& order) {
-    return order.phase == Phase::Arrived && order.report == Report::NotYet;
+    return (order.phase == Phase::Arrived || order.fewerAgreed) && order.report == Report::NotYet;
+}
+
+SendingPhase LabReport::endWhereLeft() const {
+    return isDueAsAgreed() ? SendingPhase::AllThere : SendingPhase::Success;
 }
 
 void LabReport::tell(ReportCalls& calls) {
@@ -86,6 +96,10 @@ bool LabReport::mayTellAgain() const {
         return false;
     const OrderState& order = m_order->state();
     return order.report != Report::NotYet || order.phase == OrderState::Phase::Arrived || order.fewerAgreed;
+}
+
+bool LabReport::wasTold() const {
+    return m_order && m_order->state().report == Report::Done;
 }
 
 bool LabReport::isEndUnknown() const {

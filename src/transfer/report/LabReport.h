@@ -39,8 +39,13 @@ public:
     // For an order that lay whole on the server before anything was sent, after keepArrival(): true where the lab has
     // yet to be told of it.
     bool isDueWhereFound() const;
+    // The order has arrived with the fewer pictures that the customer has agreed to; due: the lab has yet to be told.
+    bool isAsAgreed() const;
+    bool isDueAsAgreed() const;
     // The order has arrived, and only the lab was not told of it yet.
     static bool isLeft(const OrderState& order);
+    // The end of a sending that only tells the lab.
+    SendingPhase endWhereLeft() const;
 
     void tell(ReportCalls& calls);
     // For an operator, whatever was told before.
@@ -50,6 +55,8 @@ public:
 
     // A telling was begun, now or earlier.
     bool mayTellAgain() const;
+    // The lab was told to the end.
+    bool wasTold() const;
     // A telling was begun, and it is not known whether the lab has heard it.
     bool isEndUnknown() const;
     // The order has arrived, and the server told no lengths to prove it by. As built in none are asked for.

@@ -17,6 +17,10 @@ bool ReportOnce::isWanted(Sender by) const {
     return sending == Sending::NewOrder || (m_state.Careful && sending == Sending::Resend);
 }
 
+bool ReportOnce::hasArrived() const {
+    return m_journal.state().phase >= Phase::Arrived || m_journal.state().fewerAgreed;
+}
+
 bool ReportOnce::keep(const Result<void>& written) {
     if (m_kept)
         m_kept = written;
@@ -31,7 +35,7 @@ std::optional<ReportOnce::Told> ReportOnce::toldOrUnwanted() const {
         return Told::Before;
     if (order.report == Report::Begun)
         return Told::NotKnown;
-    if (order.phase < Phase::Arrived || m_state.transfer.SugMishloah == Sending::Chain)
+    if (!hasArrived() || m_state.transfer.SugMishloah == Sending::Chain)
         return Told::NotWanted;
     return std::nullopt;
 }
@@ -42,7 +46,7 @@ ReportOnce::Told ReportOnce::tell(Sender by, ReportCalls& calls) {
         return *before;
     if (isWanted(by))
         return request(calls);
-    if (m_journal.state().phase >= Phase::Arrived)
+    if (hasArrived())
         keep(m_journal.needsNoReport());
     return Told::NotWanted;
 }
@@ -65,7 +69,7 @@ ReportOnce::Told ReportOnce::tellAgain(ReportCalls& calls) {
 ReportOnce::Told ReportOnce::request(ReportCalls& calls) {
     if (isStopped())
         return Told::Cut;
-    const bool ofAnArrival = m_journal.state().phase >= Phase::Arrived || m_journal.state().report != Report::NotYet;
+    const bool ofAnArrival = hasArrived() || m_journal.state().report != Report::NotYet;
     if (ofAnArrival && !keep(m_journal.reportBegun()) && m_state.Careful)
         return Told::NotKept;
     if (!makeCalls(calls))
