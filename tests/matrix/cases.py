@@ -22,8 +22,8 @@ LAB = (FOLDER / 'lab.ini.in').read_text()
 class Tools:
     """The programs under test and what all cases share."""
 
-    def __init__(self, drive, quick_time, pictures, scratch, unpacked):
-        self.drive, self.quick_time, self.scratch, self.unpacked = drive, quick_time, scratch, unpacked
+    def __init__(self, drive, quick_time, pictures, scratch, unpacked, kept):
+        self.drive, self.quick_time, self.scratch, self.unpacked, self.kept = drive, quick_time, scratch, unpacked, kept
         self.make_pictures = pictures
         self.pictures, self.other_pictures = self.shown('shown', PICTURES, '0.2'), self.shown('shown-other', PICTURES, '0.1')
         self.crypt = subprocess.check_output(['openssl', 'passwd', '-6', PASSWORD], text=True).strip()
@@ -127,6 +127,7 @@ class Case:
         self.foreign = self.first_proof = self.ftp = self.relay = self.pictures = None
         self.order_of = 'plain' if way == 'ftp' else 'edited'   # the scenario
         self.count = PICTURES
+        self.kept = tools.kept    # the FTP session
 
     # --- the two ends
 
@@ -212,6 +213,8 @@ class Case:
         text += '[Guards]\nCareful = yes\n' if self.careful else ''
         if self.server in ('pure-ftpd', 'proftpd') and not self.fault.as_installed:
             text = text.replace('[Addresses]', 'Type = I\n[Addresses]')
+        if self.kept:
+            text = text.replace('[Addresses]', 'Session = kept\n[Addresses]')
         return text
 
     def play(self, *scenarios, healed=False, **environment):

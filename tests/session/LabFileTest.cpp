@@ -32,7 +32,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "Password = \" a;b#c=d \"\n"
               "Folder1 = \xD7\x90\n"
               "JppChunks=32767\n"
-              "JppTail = 60\nType = i\n"
+              "JppTail = 60\nType = i\nSession = kept\n"
               "[Client]\nLetter = AS\n"
               "[Paper]\nSizes = 10/15,20/30\nQuickSizes = 10/15, 13/18, 20/30\n"
               "[Switches]\nCoupon = YES\nQuickOrder = no\nSplitPage = yes\nReports = no\nDeepCompression = "
@@ -51,6 +51,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(lab.profile.JppChunks, 32767);
     EXPECT_EQ(lab.SugTzad, 60);
     EXPECT_EQ(lab.ftpType, FtpType::Image);
+    EXPECT_TRUE(lab.keptFtpSession);
     EXPECT_EQ(lab.profile.SizeList[1], u"20/30");
     EXPECT_EQ(lab.profile.SizeList[2], u"");
     EXPECT_EQ(lab.profile.QuickSizes[2], u"20/30");
@@ -182,9 +183,9 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     EXPECT_EQ(texts(given), texts(builtIn));
     EXPECT_EQ(example.deployment.SugTzad, Deployment().SugTzad);
     EXPECT_EQ(example.deployment.programLetter, Deployment().programLetter);
-    // The two keys whose example is not the built-in value.
-    EXPECT_TRUE(given.Careful && !given.OperatorArea);
-    EXPECT_TRUE(!builtIn.Careful && builtIn.OperatorArea);
+    // The keys whose example is not the built-in value.
+    EXPECT_TRUE(given.Careful && !given.OperatorArea && given.transfer.keptFtpSession);
+    EXPECT_TRUE(!builtIn.Careful && builtIn.OperatorArea && !builtIn.transfer.keptFtpSession);
 }
 
 TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {

@@ -15,6 +15,7 @@ struct Deployment {
     ClientProfile profile;
 
     FtpType ftpType = FtpType::Ascii; // only the FTP line uses it; dwType is 1 with both
+    bool keptFtpSession = false;      // one session a pass; else one a file
     Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;

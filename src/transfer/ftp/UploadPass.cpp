@@ -40,6 +40,7 @@ void UploadPass::beginFiles() {
     m_end.reset();
     m_silence.begin();
     m_skipped = 0;
+    m_keeps = m_transfer.keptFtpSession;
     m_running = true;
 }
 
@@ -105,6 +106,20 @@ void UploadPass::UploadOneFile(int index) {
     CurrentIndex = index;
     FaultPressed = false;
     m_stop.StopFlag = false;
+    const bool stands = m_keeps && m_session.inOrderFolder();
+    if (!stands && !reachOrderFolder())
+        return;
+    const bool good = m_session.inOrderFolder() && send(m_lists.List3.item(index));
+    // A server that ends each session behind its first put would cost every second file.
+    if (!good && m_putsOfSession == 1)
+        m_keeps = false;
+    if (!m_keeps || !good || m_stop.StopFlag || index == m_lists.List3.lastIndex())
+        closeWithPauses();
+}
+
+// False: nothing can be put, and the connection is closed.
+bool UploadPass::reachOrderFolder() {
+    m_putsOfSession = 0;
     m_events.reached(SendingMoment::Reaching);
     m_session.PauseBar(2);
     m_session.walkToLabFolder();
@@ -114,27 +129,23 @@ void UploadPass::UploadOneFile(int index) {
     if (!m_session.FolderOk) {
         closeWithPauses();
         m_events.reached(SendingMoment::Unreached);
-        return;
+        return false;
     }
     m_session.PauseBar();
-    const bool entered = m_session.EnterOrderFolder();
+    m_session.EnterOrderFolder();
     m_session.PauseBar();
     m_events.reached(SendingMoment::WalkDone);
     if (m_stop.left)
-        return;
+        return false;
     if (m_session.folderIsForeign() && !m_stop.StopFlag) {
         const bool basketKept = !m_session.journal()->state().items.isEmpty();
         const Failure why{Failure::Kind::InUse, u"the folder on the server holds another order"_s};
         m_session.log(u' ' + why.message);
         endBy(basketKept ? SendingPhase::NumberTaken : SendingPhase::CallLab, LineStep::ForeignFolder, why);
     }
-    if (m_stop.StopFlag) {
+    if (m_stop.StopFlag)
         m_session.FtpCloseConnection();
-        return;
-    }
-    if (entered)
-        send(m_lists.List3.item(index));
-    closeWithPauses();
+    return !m_stop.StopFlag;
 }
 
 void UploadPass::beginOrder(const QStringList& inHand) {
@@ -163,8 +174,10 @@ bool UploadPass::liesThere(const QString& path, const QString& name) {
     return false;
 }
 
-void UploadPass::send(const QString& path) {
+// True: the file has been put well, or the server has it.
+bool UploadPass::send(const QString& path) {
     const QString name = LeafName(path);
+    bool good = true;
     m_events.sending(CurrentIndex, m_lists.List3.count(), name);
     if (liesThere(path, name)) {
         if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
@@ -172,9 +185,10 @@ void UploadPass::send(const QString& path) {
         countDone(path);
         m_events.reached(SendingMoment::Skipped);
     } else {
-        put(path, name);
+        good = put(path, name);
     }
     m_events.reached(SendingMoment::FileDone, CurrentIndex + 1);
+    return good;
 }
 
 void UploadPass::countDone(const QString& path) {
@@ -194,23 +208,25 @@ void UploadPass::confirm(const QString& path) {
     m_session.keep(m_session.journal()->release(path));
 }
 
-void UploadPass::put(const QString& path, const QString& name) {
+bool UploadPass::put(const QString& path, const QString& name) {
     TextList& broken = m_lists.List4Broken;
     BrokenBefore = broken.count();
     if (!m_session.FtpSendFile(path)) {
         m_inHand.removeAll(path);
         if (broken.count() > BrokenBefore)
             m_session.keepBrokenFiles();
-        return;
+        return false;
     }
+    ++m_putsOfSession;
     if (IsBroken(broken, name))
         confirm(path);
     countDone(path);
     if (!m_session.lineEndsChanged(path))
-        return;
+        return true;
     broken.append(path);
     m_session.keepBrokenFiles();
     endBy(SendingPhase::CallLab, LineStep::ServerChanges, changed());
+    return true;
 }
 
 Failure UploadPass::changed() {

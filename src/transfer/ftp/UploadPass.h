@@ -8,12 +8,14 @@
 
 namespace lumora {
 
-// One pass over List3: each file in a session of its own; files that the server has are skipped.
+// One pass over List3; files that the server has are skipped. Each file has a session of its own, unless the lab keeps
+// the session: then a fault alone begins another one.
 class UploadPass {
 public:
     UploadPass(const SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
                FtpLists& lists, FtpSession& session)
-        : m_platform(platform)
+        : m_transfer(state.transfer)
+        , m_platform(platform)
         , m_events(events)
         , m_stop(stop)
         , m_lists(lists)
@@ -51,13 +53,15 @@ private:
     void endSilent();
     Failure changed();
     void tellPiece(int index);
-    void send(const QString& path);
+    bool reachOrderFolder();
+    bool send(const QString& path);
     bool liesThere(const QString& path, const QString& name);
     void confirm(const QString& path);
     void countDone(const QString& path);
-    void put(const QString& path, const QString& name);
+    bool put(const QString& path, const QString& name);
     void closeWithPauses();
 
+    const TransferState& m_transfer;
     const Platform& m_platform;
     SendingEvents& m_events;
     SendingStop& m_stop;
@@ -70,7 +74,9 @@ private:
     LineStep m_endStep = LineStep::Silence; // and why; not told where the page leads on by itself
     Failure m_endFailure;
     bool m_running = false;
-    qint64 m_skipped = 0; // bytes of the files that the server has, of this pass
+    bool m_keeps = false;    // the session stays from file to file
+    int m_putsOfSession = 0; // that were confirmed
+    qint64 m_skipped = 0;    // bytes of the files that the server has, of this pass
 };
 
 } // namespace lumora
