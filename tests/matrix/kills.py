@@ -3,7 +3,8 @@ from cases import Case
 from faults import Fault
 
 NOT_KNOWN = 'arrived whole, whether the lab was told is not known'
-GOOD = ('arrived whole', 'nothing was begun', NOT_KNOWN)
+FOUND_THERE = 'arrived whole, found there and not reported'   # as built in by HTTP
+GOOD = ('arrived whole', 'nothing was begun', NOT_KNOWN, FOUND_THERE)
 ORDERS = {('plain', 'ftp'): 'plain order by FTP', ('edited', 'ftp'): 'edited order by FTP', ('edited', 'http'): 'edited order by HTTP'}
 FILES = {'ftp': 6, 'http': 5}   # of an order: log, sheet, three prints, by FTP the small picture
 POINTS = ('before', 'in', 'after')
@@ -114,6 +115,9 @@ class Kill(Case):
         self.good = self.result in GOOD and not self.found
         return self
 
+    def is_reported(self):
+        return any(route == 'REPORT' and '?' in path for route, path in self.web.asked)
+
     def play_case(self):
         self.result, self.found = 'NOT KILLED', []
         if self.play(self.order_of, self.way, **self.environment) or self.mine.status != -9:
@@ -127,7 +131,7 @@ class Kill(Case):
         state = (first / '.order').read_bytes() if begun and (first / '.order').is_file() else b''
         if b'"Phase","reported"' in state or b'"Report","begun"' in state:
             # It has arrived, and a report that may have been heard is not sent twice: nothing is offered.
-            arrived = any(route == 'REPORT' and '?' in path for route, path in self.web.asked)
+            arrived = self.is_reported()
             self.result = 'arrived whole' if b'"Phase","reported"' in state else NOT_KNOWN
             if self.missing():
                 self.result = 'LIE: files missing or damaged'
@@ -135,6 +139,8 @@ class Kill(Case):
             self.first_proof = self.mine.files().get('000.jpg')
             self.result = self.verdict(self.play('goon', self.way, healed=True))
             arrived = self.mine.told() == 'arrived'
+            if arrived and self.way == 'http' and not self.careful and not self.is_reported():
+                self.result, arrived = FOUND_THERE, False
             self.found = self.beside(1 if arrived else 0)
         last = self.verdict(self.play(self.order_of, self.way, healed=True))
         if begun and self.mine.order() == first:
