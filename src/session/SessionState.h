@@ -190,7 +190,7 @@ struct TransferState {
     Sender SugSheliach = Sender::Ftp;
     Sending SugMishloah = Sending::NewOrder;
     Travel Mefurak = Travel::Whole;
-    bool keptFtpSession = false; // one FTP session a pass; else one a file
+    bool keptFtpSession = false;     // one FTP session a pass; else one a file
     std::int16_t KeSherLaSharat = 0; // three values that the order log carries and nothing sets
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;
