@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/FixedText.h"
+#include "order/TailTelephone.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -18,14 +19,20 @@ QByteArray field(const QString& text, int width) {
 } // namespace
 
 OrderTail OrderTail::of(const SessionState& state) {
-    return {state.shemot.n2,     state.shemot.n1,  QString::number(state.shemot.TotalPics),
-            state.MisparHazmana, state.shemot.ser, {}};
+    const bool photographer = state.Optint == OrderKind::Album && state.albumTail == AlbumTail::Photographer;
+    const QString& telephone = photographer ? state.album.TelZalam : state.shemot.n2;
+    return {TailTelephone(state).of(telephone),
+            photographer ? state.album.ShemZalam : state.shemot.n1,
+            QString::number(state.shemot.TotalPics),
+            state.MisparHazmana,
+            state.shemot.ser,
+            {}};
 }
 
 QByteArray OrderTail::shortForm() const {
     // The first two fields once held the number of a split print's piece and the count of pieces; both are always 1.
-    return field(u"1"_s, 2) + field(u"1"_s, 2) + field(telephone, 10) + field(name, 10) + field(totalPics, 3) +
-           field(orderNumber, 3) + field(serial, 4) + field({}, 6);
+    return field(u"1"_s, 2) + field(u"1"_s, 2) + field(telephone, TailTelephone::width) + field(name, 10) +
+           field(totalPics, 3) + field(orderNumber, 3) + field(serial, 4) + field({}, 6);
 }
 
 QByteArray OrderTail::longForm(const QString& base) const {

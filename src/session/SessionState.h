@@ -111,7 +111,7 @@ struct AlbumDetails {
 // An order paid by a coupon of a fixed quantity.
 struct CouponState {
     std::int16_t HaKoopon = 0;     // 1: the quantity is checked
-    std::int16_t MisparKoopon = 0; // pictures the coupon holds
+    std::int16_t MisparKoopon = 0; // pictures the coupon holds; with Careful 0 for a size without a coupon
     std::int16_t SmallCount = 0;   // quantities of the two sizes of the product
     std::int16_t LargeCount = 0;
 };
@@ -168,6 +168,9 @@ constexpr bool printsAsTheyAre(OrderKind kind) {
 }
 
 enum class Sender : std::int16_t { Ftp = 0, Http = 1 };
+
+// Whose name and telephone the tail of an album's print files carries.
+enum class AlbumTail : std::int16_t { Customer, Photographer };
 
 enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
 
@@ -235,8 +238,9 @@ struct SessionState {
     bool SplitPage = false;              // the finished orders lead to the pieces, an operator's tool
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
     bool Careful = false;                // the guards of docs/guards.md are on
-    bool offerPutOff = false;            // the customer has put off the unfinished orders for this run
-    bool OperatorArea = true;            // a customer may open the hidden area of the sending page
+    AlbumTail albumTail = AlbumTail::Customer;
+    bool offerPutOff = false; // the customer has put off the unfinished orders for this run
+    bool OperatorArea = true; // a customer may open the hidden area of the sending page
 
     ClientProfile profile;
     OrderDetails shemot;

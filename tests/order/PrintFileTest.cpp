@@ -2,8 +2,10 @@
 
 #include "order/OrderTail.h"
 #include "order/PrintFileName.h"
+#include "order/TailTelephone.h"
 #include "support/DrivePathLiteral.h"
 #include "support/ExampleOrder.h"
+#include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
 
@@ -109,6 +111,34 @@ TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
 
     state.shemot.n1 = QString::fromUtf8("\U0001F600\U0001F600");
     EXPECT_EQ(OrderTail::of(state).shortForm().size(), 40) << "a character outside the code page is one byte";
+}
+
+TEST(OrderTail, carriesTenDigitsOfALongTelephoneAndAsksForMore) {
+    const struct {
+        QString typed, builtIn, careful;
+        bool asks;
+    } cases[] = {{u"03-1234567"_s, u"03-1234567"_s, u"03-1234567"_s, false},
+                 {u"052-7654321"_s, u"052-765432"_s, u"0527654321"_s, false},
+                 {u"+972-52-765 4321 "_s, u"+972-52-76"_s, u"0527654321"_s, false},
+                 {u"+1 212 555 01 23 4"_s, u"+1 212 555"_s, u"+121255501"_s, true}};
+    SessionState state = exampleOrder();
+    for (const auto& c : cases) {
+        state.shemot.n2 = state.album.TelZalam = c.typed;
+        for (const bool careful : {false, true}) {
+            state.Careful = careful;
+            EXPECT_EQ(OrderTail::parse(OrderTail::of(state).shortForm())->telephone, careful ? c.careful : c.builtIn);
+            RecordedDialogs dialogs;
+            EXPECT_EQ(TailTelephone(state).mayBe(c.typed, dialogs), !(careful && c.asks)) << c.typed.toStdString();
+            EXPECT_EQ(dialogs.questions.size(), careful && c.asks ? 1 : 0);
+        }
+    }
+    state.album.ShemZalam = u"Studio Or"_s;
+    state.Optint = OrderKind::Album;
+    EXPECT_EQ(OrderTail::of(state).name, u"Dana Levi"_s);
+    state.albumTail = AlbumTail::Photographer;
+    EXPECT_EQ(OrderTail::of(state).name, u"Studio Or"_s);
+    state.Optint = OrderKind::Print;
+    EXPECT_EQ(OrderTail::of(state).name, u"Dana Levi"_s);
 }
 
 TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {

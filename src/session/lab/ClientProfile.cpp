@@ -49,6 +49,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.SplitPage = deployment.SplitPage;
     state.Careful = deployment.Careful;
     state.OperatorArea = deployment.OperatorArea;
+    state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.transfer.keptFtpSession = deployment.keptFtpSession;

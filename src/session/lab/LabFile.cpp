@@ -66,6 +66,19 @@ void checkFilled(IniReader& reader, const Needed& needed) {
     }
 }
 
+// The limit of a coupon belongs to these two sizes, and only a size placed in front sets it.
+void checkCouponSizes(IniReader& reader, const Deployment& deployment) {
+    if (!deployment.Careful || deployment.HaKoopon != 1 || !reader.errors().filter(u"Paper.QuickSizes"_s).isEmpty())
+        return;
+    const auto& sizes = deployment.profile.QuickSizes;
+    for (const QString& size : {u"10/15"_s, u"20/30"_s}) {
+        if (std::find(sizes.begin(), sizes.end(), size) == sizes.end())
+            reader.fail(reader.lineOf(u"Switches.Coupon"_s),
+                        u"Switches.Coupon is yes, and Paper.QuickSizes lacks %1; allowed with it: sizes with 10/15 and "
+                        "20/30 among them"_s.arg(size));
+    }
+}
+
 void checkTogether(IniReader& reader, const Deployment& deployment) {
     const ClientProfile& profile = deployment.profile;
     if (deployment.SugSheliach == Sender::Http)
@@ -75,6 +88,7 @@ void checkTogether(IniReader& reader, const Deployment& deployment) {
                              {{u"HttpHost"_s, profile.HttpHost},
                               {u"HttpTikiya"_s, profile.HttpTikiya},
                               {u"HttpScriptPath"_s, profile.HttpScriptPath}}});
+    checkCouponSizes(reader, deployment);
     if (profile.mail.setUp())
         checkFilled(
             reader,

@@ -192,6 +192,10 @@ std::vector<Row> rows() {
         {"Paper", "Sizes", sizes(&P::SizeList)},
         {"Paper", "QuickSizes", sizes(&P::QuickSizes)},
 
+        {"Album", "Tail",
+         words<AlbumTail>(at(&D::albumTail), u"customer or photographer"_s,
+                          {{u"customer"_s, AlbumTail::Customer}, {u"photographer"_s, AlbumTail::Photographer}})},
+
         {"Addresses", "Site",
          text(at(&P::SiteUrl), u"an address that begins with http:// or https:// and ends in a slash"_s,
               u"https?://[^\\s/]+(/[^\\s]*)?/"_s)},

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QString>
+
+namespace lumora {
+
+class Dialogs;
+struct SessionState;
+
+// The telephone in the tail of a print file, which has ten characters. As built in, a longer number loses its last
+// digits there. Log, sheet and report have what was typed.
+class TailTelephone {
+public:
+    explicit TailTelephone(const SessionState& state)
+        : m_state(state) {}
+
+    static constexpr int width = 10;
+
+    // The number for the tail, not yet cut to its width.
+    QString of(const QString& typed) const;
+    // Asks the customer where the tail would still cut the number; false: it is to be set right.
+    bool mayBe(const QString& typed, Dialogs& dialogs) const;
+
+    // A number of more than ten characters with 0 in place of "+972", then without hyphens and blanks.
+    static QString squeezed(const QString& typed);
+
+private:
+    const SessionState& m_state;
+};
+
+} // namespace lumora
