@@ -83,10 +83,5 @@ TEST(TextToHex, CarriesANameThereAndBack) {
     EXPECT_EQ(HexToChars(u"4142zz43"_s), u"AB"_s + QChar(0) + u'C');
 }
 
-TEST(FixedText, PadsNumbers) {
-    EXPECT_EQ(ZeroPadded(7, 4), u"0007"_s);
-    EXPECT_EQ(ZeroPadded(12345, 4), u"2345"_s);
-}
-
 } // namespace
 } // namespace lumora

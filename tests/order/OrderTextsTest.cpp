@@ -1,4 +1,5 @@
 #include "order/BrokenFiles.h"
+#include "order/MailAddressGuard.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
@@ -29,6 +30,30 @@ TEST(TimeOfJob, HasDayCodeAndVolumeInFixedPlaces) {
     EXPECT_EQ(BuildTimeOfJob(QDate(2026, 11, 21), u"KUP"_s, u"1234"_s), u"2026_11_21_KUP_1234^");
     EXPECT_EQ(BuildTimeOfJob(QDate(987, 1, 2), u"P"_s, QString()), u"0987_01_02_P  _^");
     EXPECT_EQ(BuildTimeOfJob(QDate(2026, 1, 2), u"LONG"_s, u"7"_s), u"2026_01_02_LON_7^");
+}
+
+TEST(MailAddressGuard, TakesAWholeAddressAsItIsAndNeverThePrompt) {
+    const TypedAddress prompt{u"dana"_s, u"Choose or type"_s, true};
+    const struct {
+        TypedAddress typed;
+        QString builtIn, careful;
+        bool asks;
+    } cases[] = {
+        {{u"dana"_s, u"example.com"_s}, u"dana@example.com"_s, u"dana@example.com"_s, false},
+        {{u" d@lab.example"_s, u"gmail.com"_s}, u" d@lab.example@gmail.com"_s, u"d@lab.example"_s, false},
+        {{u"dana@"_s, u"@example.com"_s}, u"dana@@@example.com"_s, u"dana@example.com"_s, false},
+        {prompt, u"dana@Choose or type"_s, u"dana"_s, true},
+        {{{}, u"Choose or type"_s, true}, u"@Choose or type"_s, {}, false},
+        {{{}, u"gmail.com"_s}, u"@gmail.com"_s, {}, false},
+    };
+    SessionState state;
+    for (const auto& c : cases) {
+        for (const bool careful : {false, true}) {
+            state.Careful = careful;
+            EXPECT_EQ(MailAddressGuard(state).address(c.typed), careful ? c.careful : c.builtIn);
+            EXPECT_EQ(MailAddressGuard(state).lacksDomain(c.typed), careful && c.asks) << c.builtIn.toStdString();
+        }
+    }
 }
 
 TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {

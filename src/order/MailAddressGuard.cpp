@@ -1,0 +1,49 @@
+#include "order/MailAddressGuard.h"
+
+#include "session/SessionState.h"
+
+namespace lumora {
+
+namespace {
+
+bool isWhole(const QString& name) {
+    const qsizetype at = name.indexOf(u'@');
+    return at > 0 && at < name.size() - 1;
+}
+
+QString nameIn(const TypedAddress& typed) {
+    QString name = typed.name.trimmed();
+    if (name.endsWith(u'@'))
+        name.chop(1);
+    return name;
+}
+
+QString domainIn(const TypedAddress& typed) {
+    if (typed.untouched)
+        return {};
+    QString domain = typed.domain.trimmed();
+    if (domain.startsWith(u'@'))
+        domain.remove(0, 1);
+    return domain;
+}
+
+} // namespace
+
+QString MailAddressGuard::address(const TypedAddress& typed) const {
+    if (!m_state.Careful)
+        return typed.name + u'@' + typed.domain;
+    const QString name = nameIn(typed);
+    const QString domain = domainIn(typed);
+    return name.isEmpty() || isWhole(name) || domain.isEmpty() ? name : name + u'@' + domain;
+}
+
+bool MailAddressGuard::lacksDomain(const TypedAddress& typed) const {
+    const QString name = nameIn(typed);
+    return m_state.Careful && !name.isEmpty() && !isWhole(name) && domainIn(typed).isEmpty();
+}
+
+bool MailAddressGuard::keepsDomain(const TypedAddress& typed) const {
+    return m_state.Careful && !domainIn(typed).isEmpty();
+}
+
+} // namespace lumora
