@@ -16,32 +16,34 @@ namespace {
 TEST(TileMenuTest, ShowsTheTilesOfEachKindOfClient) {
     const struct {
         QString letter;
-        int tmunatPaar;
-        int minuyPaar;
+        std::int16_t tmunatPaar;
+        std::int16_t minuyPaar;
         QString tiles; // a digit for each tile that is there
     } cases[] = {
         {"B", 0, 1, "023458"},    {"C", 0, 1, "02458"},    {"D", 0, 1, "0258"},      {"CL", 0, 1, "024568"},
         {"AL", 0, 1, "0124568"},  {"AS", 0, 1, "0124589"}, {"ALL", 0, 1, "0123458"}, {"", 0, 1, "0123458"},
         {"AL", 1, 1, "01245678"}, {"AL", 0, 2, "024568"},  {"AS", 1, 2, "0245789"},
     };
+    SessionState state;
     for (const auto& c : cases) {
-        QString shown;
-        const auto tiles = visibleTiles(c.letter, c.tmunatPaar, c.minuyPaar);
-        for (std::size_t i = 0; i < tiles.size(); ++i) {
-            if (tiles[i])
-                shown += QString::number(i);
+        state.profile.ClientLetter = c.letter;
+        state.TmunatPaar = c.tmunatPaar;
+        state.MinuyPaar = c.minuyPaar;
+        for (const bool careful : {false, true}) {
+            state.Careful = careful;
+            QString shown;
+            const auto tiles = visibleTiles(state);
+            for (std::size_t i = 0; i < tiles.size(); ++i) {
+                if (tiles[i])
+                    shown += QString::number(i);
+            }
+            EXPECT_EQ(shown, careful ? QString(c.tiles).remove(u'3') : c.tiles) << c.letter.toStdString();
         }
-        EXPECT_EQ(shown, c.tiles) << c.letter.toStdString() << c.tmunatPaar << c.minuyPaar;
     }
 }
 
 TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
-    FixedVolume volume;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_path)), u"1234");
-    volume.number = -12;
-    EXPECT_EQ(volumeMark(*ReadVolumeSerial(volume, u"C:\\"_path)), u"-12");
-    volume.fails = true;
-    EXPECT_FALSE(ReadVolumeSerial(volume, u"C:\\"_path).ok());
+    EXPECT_EQ(volumeMark(u"-987651234"_s) + volumeMark(u"-12"_s), u"1234-12");
 }
 
 TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
@@ -54,25 +56,18 @@ TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
     EXPECT_EQ(good.shemot.n1, u"Dana Levi");
     EXPECT_FALSE(CheckDetails(good)) << "a telephone with letters passes";
 
-    const struct {
-        std::function<void(OrderDetails&)> spoil;
-        Place place;
-        QString told;
-    } cases[] = {
-        {[](OrderDetails& d) { d = {}; }, Place::Name, u"First & Last Name"_s},
-        {[](OrderDetails& d) { d.n2.clear(), d.ppr = notChosen; }, Place::Telephone, u"Phone"_s},
-        {[](OrderDetails& d) { d.ppr = d.maat = notChosen; }, Place::Size, u"paper size"_s},
-        {[](OrderDetails& d) { d.maat = notChosen, d.Bord.clear(); }, Place::Kind, u"matte or glossy"_s},
-        {[](OrderDetails& d) { d.Bord.clear(); }, Place::Border, u"border"_s},
+    const std::pair<std::function<void(OrderDetails&)>, Place> cases[] = {
+        {[](OrderDetails& d) { d = {}; }, Place::Name},
+        {[](OrderDetails& d) { d.n2.clear(), d.ppr = notChosen; }, Place::Telephone},
+        {[](OrderDetails& d) { d.ppr = d.maat = notChosen; }, Place::Size},
+        {[](OrderDetails& d) { d.maat = notChosen, d.Bord.clear(); }, Place::Kind},
+        {[](OrderDetails& d) { d.Bord.clear(); }, Place::Border},
     };
-    good.EnglishTips = 1;
-    for (const auto& c : cases) {
+    for (const auto& [spoil, place] : cases) {
         SessionState state = good;
-        c.spoil(state.shemot);
-        const auto problem = CheckDetails(state);
-        ASSERT_TRUE(problem) << c.told.toStdString();
-        EXPECT_TRUE(problem->message.contains(c.told)) << problem->message.toStdString();
-        EXPECT_EQ(problem->place, c.place);
+        spoil(state.shemot);
+        ASSERT_TRUE(CheckDetails(state));
+        EXPECT_EQ(CheckDetails(state)->place, place);
     }
     good.MishloachHabaita = true;
     ASSERT_TRUE(CheckDetails(good));
@@ -95,13 +90,9 @@ TEST_F(DetailStoreTest, KeepsNameAndTelephoneInFiveLines) {
     ASSERT_TRUE(store.SaveDetails({u"דנה \"לוי"_s, u"03-1"_s}).ok());
     EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim.txt"_path),
               "0\r\n\"\xE3\xF0\xE4 \"\xEC\xE5\xE9\"\r\n\"03-1\"\r\n0\r\n0\r\n");
-    const auto read = store.details();
-    ASSERT_TRUE(read.ok() && *read);
-    EXPECT_EQ((*read)->name, u"דנה \"לוי");
-    EXPECT_EQ((*read)->telephone, u"03-1");
-    EXPECT_TRUE(store.forgetDetails().ok());
-    EXPECT_FALSE(*store.details());
-    EXPECT_TRUE(store.forgetDetails().ok());
+    EXPECT_EQ((**store.details()).name, u"דנה \"לוי");
+    for (int again = 0; again < 2; ++again)
+        EXPECT_TRUE(store.forgetDetails().ok() && !*store.details());
 }
 
 TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {

@@ -26,6 +26,39 @@ protected:
         }
         return page;
     }
+    void checkTheDetails() {
+        nnn& page = start();
+        state.MishloachHabaita = true;
+        page.Image1_Click(0);
+        const std::pair<const char*, std::function<void()>> missing[] = {
+            {"Text2", [&] { page.Text2_Change(u"Dana"_s); }}, {"Text4", [&] { page.Text4_Change(u"Haifa"_s); }}};
+        for (const auto& [box, fill] : missing) {
+            const int focused = page.focus().request;
+            page.Command12_Click();
+            EXPECT_EQ(page.focus().control, QLatin1String(box));
+            EXPECT_GT(page.focus().request, focused);
+            fill();
+        }
+        EXPECT_EQ(machine.dialogs.messages.size(), 2);
+        page.Text3_Change(u"052-7654321-12"_s);
+        page.Command12_Click();
+        EXPECT_EQ(page.step(), state.Careful ? nnn::Step::Details : nnn::Step::Options);
+        EXPECT_EQ(page.focus().control, state.Careful ? u"Text3"_s : u"Text4"_s);
+        machine.dialogs.answers = {true};
+        page.Command12_Click();
+        EXPECT_EQ(page.step(), nnn::Step::Options);
+        EXPECT_EQ(machine.files.fileExists(customerStore), !state.Careful);
+        // The page's end forgets them, unless the customer asked to be remembered.
+        page.Text3_Change(u"03-1"_s);
+        ASSERT_TRUE(machine.files.writeWhole(customerStore, "of an earlier customer").ok());
+        page.Option1_Click(0);
+        page.Option3_Click(1);
+        page.Image13_MouseDown(9);
+        page.Command6_Click();
+        page.Check1_Click(true);
+        page.Command3_Click();
+        EXPECT_FALSE(machine.files.fileExists(customerStore));
+    }
 };
 
 TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
@@ -78,14 +111,6 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     EXPECT_TRUE(machine.files.folderExists(u"C:\\vedron"_path));
     EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_path));
     EXPECT_TRUE(machine.files.fileExists(customerStore));
-}
-
-TEST_F(nnnTest, StaysWithAReasonWhenTheWorkspaceCannotBeMade) {
-    ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora"_path, "in the way").ok());
-    nnn& page = start();
-    page.Image1_Click(0);
-    EXPECT_EQ(page.step(), nnn::Step::Menu);
-    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(u"2000lumora"));
 }
 
 TEST_F(nnnTest, AsksForBorderAndFitByKindOfOrderAndSwitches) {
@@ -164,31 +189,12 @@ TEST_F(nnnTest, ATileForgetsTheChoicesOfTheOrderBefore) {
 }
 
 TEST_F(nnnTest, ChecksTheDetailsBeforeTheOptions) {
-    nnn& page = start();
-    state.MishloachHabaita = true;
-    page.Image1_Click(0);
-    const std::pair<const char*, std::function<void()>> missing[] = {{"Text2", [&] { page.Text2_Change(u"Dana"_s); }},
-                                                                     {"Text4", [&] { page.Text4_Change(u"Haifa"_s); }}};
-    for (const auto& [box, fill] : missing) {
-        const int focused = page.focus().request;
-        page.Command12_Click();
-        EXPECT_EQ(page.focus().control, QLatin1String(box));
-        EXPECT_GT(page.focus().request, focused);
-        fill();
+    for (const bool careful : {false, true}) {
+        chain.unload(PageId::kyoskNew);
+        deployment.Careful = careful;
+        machine.dialogs.answers.clear();
+        checkTheDetails();
     }
-    EXPECT_EQ(machine.dialogs.messages.size(), 2);
-    page.Command12_Click();
-    EXPECT_EQ(page.step(), nnn::Step::Options);
-    EXPECT_TRUE(machine.files.fileExists(customerStore));
-    // The page's end forgets them, unless the customer asked to be remembered.
-    page.Text3_Change(u"03-1"_s);
-    page.Option1_Click(0);
-    page.Option3_Click(1);
-    page.Image13_MouseDown(9);
-    page.Command6_Click();
-    page.Check1_Click(true);
-    page.Command3_Click();
-    EXPECT_FALSE(machine.files.fileExists(customerStore));
 }
 
 TEST_F(nnnTest, TakesTheDetailsFromMemory) {
@@ -223,6 +229,9 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
 
     page->Image1_Click(8);
     EXPECT_EQ(page->controls().Command10.text, u"Details from memory");
+    EXPECT_TRUE(page->controls().Command4Ivrit.visible);
+    page->Command4Ivrit_Click();
+    EXPECT_EQ(page->controls().Command10.text, u"פרטים מהזיכרון");
     page->Image1_Click(4);
     EXPECT_EQ(state.Optint, OrderKind::Mail);
     EXPECT_TRUE(machine.files.fileExists(u"C:\\2000lumora\\!!000\\mana.txt"_path));
@@ -341,15 +350,23 @@ TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
     EXPECT_EQ(state.coupon.MisparKoopon, 350) << "the list of all sizes sets no limit";
     chain.unload(PageId::nnn);
     deployment.HaKoopon = 1;
-    start().Option1_Click(0);
-    EXPECT_EQ(state.coupon.MisparKoopon, 220) << "a lab that takes coupons sells this one unless it says otherwise";
+    for (const bool careful : {false, true}) {
+        nnn& next = start();
+        state.Careful = careful;
+        next.Option1_Click(0);
+        EXPECT_EQ(state.coupon.MisparKoopon, 220) << "a lab that takes coupons sells this one unless it says otherwise";
+        next.Combo1_Click(4);
+        EXPECT_EQ(machine.dialogs.messages.size(), careful ? 1 : 0);
+        EXPECT_EQ(state.coupon.MisparKoopon, careful ? 0 : 220);
+        next.Option1_Click(0);
+        next.Image1_Click(0);
+        EXPECT_EQ(state.coupon.MisparKoopon, careful ? 0 : 220) << "of an earlier customer";
+    }
 }
 
 TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
     nnn& page = start();
     page.Image1_Click(1);
-    const DrivePath store = u"C:\\2000lumora\\pratim3.txt"_path;
-    ASSERT_TRUE(machine.files.writeWhole(store, "0\r\n").ok());
     page.QuickCheck();
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     page.Text2_Change(u" Dana "_s);
@@ -358,7 +375,6 @@ TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
     const OrderDetails& details = state.shemot;
     EXPECT_EQ(QStringList({details.n1, details.n2, details.ppr, details.maat, details.Bord, details.FillFit}),
               QStringList({"Dana", "Dana", "10/15", "מבריק", "NB", "FIT"}));
-    EXPECT_FALSE(machine.files.fileExists(store));
 }
 
 } // namespace

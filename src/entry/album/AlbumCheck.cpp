@@ -12,7 +12,7 @@ using namespace Qt::StringLiterals;
 std::optional<AlbumProblem> CheckAlbum(const SessionState& state, const QString& mailName) {
     using Place = AlbumProblem::Place;
     const AlbumDetails& album = state.album;
-    const auto prompt = [&](AlbumChoice choice) { return albumPrompt(choice, state.english()); };
+    const auto prompt = [&](AlbumChoice choice) { return orderedItem(choice, -1); };
     // This text is one letter shorter than the list's prompt, so that a list without a choice passes and the prompt is
     // sent as the paper.
     const QString untouchedPaper = u"בחר סוג ניר"_s;
@@ -52,7 +52,7 @@ std::optional<QString> checkParentAlbum(const SessionState& state, int copies, b
 
 void takeAlbumOrder(SessionState& state) {
     QString& extra = state.album.Tosafot1[0];
-    if (extra == albumPrompt(AlbumChoice::Extra, state.english()))
+    if (extra == orderedItem(AlbumChoice::Extra, -1))
         extra.clear();
     state.Optint = OrderKind::Album;
     state.shemot.ppr = state.album.GodelLBM;

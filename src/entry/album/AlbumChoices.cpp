@@ -66,4 +66,9 @@ QStringList albumItems(AlbumChoice choice, bool english) {
     return english && !list.englishItems.isEmpty() ? list.englishItems : list.items;
 }
 
+QString orderedItem(AlbumChoice choice, int row) {
+    const AlbumList list = listOf(choice);
+    return list.items.value(row, list.prompt);
+}
+
 } // namespace lumora

@@ -16,9 +16,12 @@ enum class AlbumChoice {
     SpecialExtra, // Check3
 };
 
-// The text of the list before a row is taken.
+// What the pages show: the text of the list before a row is taken, and its rows.
 QString albumPrompt(AlbumChoice choice, bool english);
 QStringList albumItems(AlbumChoice choice, bool english);
+// What the order carries for a row in either language: the Hebrew item, or the Hebrew prompt for a row that is not
+// there.
+QString orderedItem(AlbumChoice choice, int row);
 
 // The most copies of the album that the parents can have.
 constexpr int mostParentCopies = 4;

@@ -3,6 +3,7 @@
 #include "common/FixedText.h"
 #include "entry/details/DetailStore.h"
 #include "entry/details/DetailsCheck.h"
+#include "order/TailTelephone.h"
 #include "platform/Dialogs.h"
 #include "session/SessionState.h"
 #include "session/lab/MailDomains.h"
@@ -38,9 +39,10 @@ bool AlbumPanels::english() const {
 }
 
 void AlbumPanels::begin() {
-    Combo4Mail.fill(mailDomains(), mailDomainPrompt(english()));
-    greyKinds();
+    if (!MailAddressGuard(m_state).keepsDomain(typedAddress()))
+        Combo4Mail.fill(mailDomains(), mailDomainPrompt(english()));
     m_kind = -1;
+    showKinds();
     Label17.text = kindName();
     addParents(false);
     Combo4Horim.fill({}, promptOf(AlbumChoice::ParentSize));
@@ -110,6 +112,14 @@ void AlbumPanels::recallPhotographer() {
 }
 
 void AlbumPanels::leavePhotographer() {
+    if (!telephoneMayBe())
+        return;
+    if (MailAddressGuard(m_state).lacksDomain(typedAddress())) {
+        m_platform.dialogs.message(m_state.wording(u"נא לבחור או להקליד את ספק הדואר,\nאחרי השטרודל",
+                                                   u"Please choose or type the mail provider,\nbehind the at sign"));
+        Q_EMIT focusWanted(u"Combo4Mail"_s);
+        return;
+    }
     if (Check5.checked) {
         const Result<void> saved =
             DetailStore(m_state, m_platform.files).SaveAlbumDetails({Text1[0].text, Text1[1].text, Text1[3].text});
@@ -117,27 +127,37 @@ void AlbumPanels::leavePhotographer() {
         if (!saved)
             m_platform.dialogs.message(saved.failure().message);
     }
-    greyKinds();
+    showKinds();
     open(Panel::Kind);
+}
+
+// Only a telephone that the print files carry has to fit there.
+bool AlbumPanels::telephoneMayBe() {
+    if (m_state.albumTail != AlbumTail::Photographer)
+        return true;
+    const bool fits = TailTelephone(m_state).mayBe(Text1[1].text, m_platform.dialogs);
+    if (!Pic4Alboom.visible)
+        return false;
+    if (!fits)
+        Q_EMIT focusWanted(u"Text1(1)"_s);
+    return fits;
 }
 
 // --- which kind, and the parents' copies ---
 
-void AlbumPanels::greyKinds() {
-    for (KindCaption& kind : SoogAlb) {
-        kind.shade = grey;
-        kind.checked = false;
+// All kinds are grey but the one that is taken.
+void AlbumPanels::showKinds() {
+    for (std::size_t i = 0; i < SoogAlb.size(); ++i) {
+        SoogAlb[i].checked = static_cast<int>(i) == m_kind;
+        SoogAlb[i].shade = SoogAlb[i].checked ? blue : grey;
     }
 }
 
 void AlbumPanels::takeKind(int kind) {
     if (kind < 0 || kind >= static_cast<int>(SoogAlb.size()))
         return;
-    const auto at = static_cast<std::size_t>(kind);
-    greyKinds();
-    SoogAlb[at].shade = blue;
-    SoogAlb[at].checked = true;
     m_kind = kind;
+    showKinds();
     Label17.text = kindName();
     // Each kind that is looked at adds its five sizes to those that are there.
     Combo4Horim.fill(Combo4Horim.rows.items() + itemsOf(AlbumChoice::ParentSize), promptOf(AlbumChoice::ParentSize));
@@ -182,21 +202,15 @@ void AlbumPanels::leaveKind() {
         Q_EMIT focusWanted(m_kind < 0 ? u"SoogAlb(0)"_s : u"Combo4Horim"_s);
         return;
     }
-    for (const ListRow& row : listTable())
-        row.list.fill(itemsOf(row.choice), promptOf(row.choice));
+    // A list is filled once, so that the choice stays when the panels open again.
+    for (const ListRow& row : listTable()) {
+        if (row.list.rows.isEmpty())
+            row.list.fill(itemsOf(row.choice), promptOf(row.choice));
+    }
     open(Panel::Size);
 }
 
 // --- size, cover, paper, extras ---
-
-// A list is filled once, so that the choice stays when its panel opens again.
-void AlbumPanels::goOnTo(Panel next) {
-    for (const ListRow& row : listTable()) {
-        if (row.panel == next && row.list.rows.isEmpty())
-            row.list.fill(itemsOf(row.choice), promptOf(row.choice));
-    }
-    open(next);
-}
 
 void AlbumPanels::goOnToBill() {
     gather();
@@ -223,14 +237,13 @@ void AlbumPanels::gather() {
     album.TelZalam = Text1[1].text.trimmed();
     album.ShemErooa = Text1[2].text.trimmed();
     album.MailZalam = mailAddress();
-    album.SoogLBM = kindName();
-    album.SoogKricha = Combo4Cricha.text;
-    album.SoogNiar = Combo4Niyar.text;
-    album.Tosafot1[0] = Combo4Tosefet.text;
-    const QStringList extras = itemsOf(AlbumChoice::SpecialExtra);
+    album.SoogLBM = m_kind >= 0 ? orderedItem(AlbumChoice::Kind, m_kind) : notChosen;
+    album.SoogKricha = orderedItem(AlbumChoice::Cover, Combo4Cricha.rows.currentIndex());
+    album.SoogNiar = orderedItem(AlbumChoice::Paper, Combo4Niyar.rows.currentIndex());
+    album.Tosafot1[0] = orderedItem(AlbumChoice::Extra, Combo4Tosefet.rows.currentIndex());
     for (std::size_t i = 0; i < Check3.size(); ++i)
-        album.Tosafot2[i] = extras[static_cast<qsizetype>(i)] + u'=' + QString::number(Check3[i].checked ? 1 : 0);
-    album.GodelLBM = Combo4Godel.text;
+        album.Tosafot2[i] = extraLine(orderedItem(AlbumChoice::SpecialExtra, static_cast<int>(i)), i);
+    album.GodelLBM = orderedItem(AlbumChoice::Size, Combo4Godel.rows.currentIndex());
     album.KamutHorim = QString::number(m_copies);
     album.SoogHorim = Combo4Horim.rows.currentItem();
     m_state.album = album;
@@ -238,11 +251,15 @@ void AlbumPanels::gather() {
     Q_EMIT changed();
 }
 
+TypedAddress AlbumPanels::typedAddress() const {
+    const QString domain = Combo4Mail.text.trimmed();
+    return {Text1[3].text.trimmed(), domain, domain.isEmpty() || domain == mailDomainPrompt(english())};
+}
+
 // A whole address in the first box is taken as it is while no domain was chosen.
 QString AlbumPanels::mailAddress() const {
-    const QString name = Text1[3].text.trimmed();
-    const QString domain = Combo4Mail.text.trimmed();
-    return name.contains(u'@') && domain == mailDomainPrompt(english()) ? name : name + u'@' + domain;
+    const TypedAddress typed = typedAddress();
+    return typed.untouched && typed.name.contains(u'@') ? typed.name : MailAddressGuard(m_state).address(typed);
 }
 
 // Opens the panel on which the photographer sets the fault right.

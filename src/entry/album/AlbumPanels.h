@@ -3,6 +3,7 @@
 #include "entry/album/AlbumCheck.h"
 #include "entry/album/AlbumChoices.h"
 #include "entry/album/AlbumControls.h"
+#include "order/MailAddressGuard.h"
 #include "platform/Platform.h"
 #include "session/Ticker.h"
 
@@ -47,11 +48,11 @@ public:
     void Combo4Horim_Click(int row) { takeParentSize(row); }
     void Command16_Click() { leaveKind(); }
     void Combo4Godel_Click(int row) { take(Combo4Godel, row); }
-    void Command18_Click() { goOnTo(Panel::Cover); }
+    void Command18_Click() { open(Panel::Cover); }
     void Combo4Cricha_Click(int row) { take(Combo4Cricha, row); }
-    void Command19_Click() { goOnTo(Panel::Paper); }
+    void Command19_Click() { open(Panel::Paper); }
     void Combo4Niyar_Click(int row) { take(Combo4Niyar, row); }
-    void Command20_Click() { goOnTo(Panel::Extras); }
+    void Command20_Click() { open(Panel::Extras); }
     void Combo4Tosefet_Click(int row) { take(Combo4Tosefet, row); }
     void Check3_Click(int extra, bool checked) { tick(Check3.at(static_cast<std::size_t>(extra)), checked); }
     void Command21_Click() { goOnToBill(); }
@@ -65,6 +66,8 @@ public:
 
     const AlbumControls& controls() const { return *this; }
     Panel panel() const { return m_panel; }
+    // Combo4Mail shows its prompt, and what is typed takes its place.
+    bool promptStands() const { return typedAddress().untouched; }
 
 Q_SIGNALS:
     void changed();
@@ -93,7 +96,8 @@ private:
     void typeDomain(const QString& text);
     void recallPhotographer();
     void leavePhotographer();
-    void greyKinds();
+    bool telephoneMayBe();
+    void showKinds();
     void takeKind(int kind);
     void addParents(bool wanted);
     void oneCopyLess();
@@ -101,7 +105,6 @@ private:
     void setCopies(int copies);
     void takeParentSize(int row);
     void leaveKind();
-    void goOnTo(Panel next);
     void goOnToBill();
     void gather();
     void writeBill();
@@ -109,8 +112,10 @@ private:
     void refuse(const AlbumProblem& problem);
     void slide(int& shift, Ticker& timer);
     void stopSliding();
+    TypedAddress typedAddress() const;
     QString mailAddress() const;
     QString kindName() const; // "***" before a kind is taken
+    QString extraLine(const QString& name, std::size_t extra) const;
     QString promptOf(AlbumChoice choice) const { return albumPrompt(choice, english()); }
     QStringList itemsOf(AlbumChoice choice) const { return albumItems(choice, english()); }
     bool english() const;

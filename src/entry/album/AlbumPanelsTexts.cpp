@@ -133,13 +133,19 @@ QString AlbumPanels::choiceSoFar() const {
     return chosen.join(u" · "_s);
 }
 
+QString AlbumPanels::extraLine(const QString& name, std::size_t extra) const {
+    return name + u'=' + QString::number(Check3[extra].checked ? 1 : 0);
+}
+
+// The bill is in the language of the page; the order itself is in Hebrew.
 void AlbumPanels::writeBill() {
     const AlbumDetails& album = m_state.album;
-    Pic4BilLines = {album.ShemZalam,  album.ShemErooa, album.TelZalam,    album.MailZalam, album.SoogLBM,
-                    album.SoogKricha, album.SoogNiar,  album.Tosafot1[0], album.GodelLBM,  album.HearotLBM};
+    Pic4BilLines = {album.ShemZalam,   album.ShemErooa,  album.TelZalam,     album.MailZalam,  kindName(),
+                    Combo4Cricha.text, Combo4Niyar.text, Combo4Tosefet.text, Combo4Godel.text, album.HearotLBM};
     Pic4BilLines.removeAll(QString());
-    Pic4BilExtras = QStringList(album.Tosafot2.begin(), album.Tosafot2.end());
-    Pic4BilExtras.removeAll(QString());
+    Pic4BilExtras.clear();
+    for (std::size_t i = 0; i < Check3.size(); ++i)
+        Pic4BilExtras += extraLine(Check3[i].text, i);
     const QString parents = m_state.wording(u"אלבום הורים", u"Parent album");
     const QString rule(25, u'_');
     Pic4BilParents = {rule, u"  "_s + parents + u"  "_s + album.KamutHorim, album.SoogHorim + u'=' + parents, rule};

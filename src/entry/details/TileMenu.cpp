@@ -14,7 +14,7 @@ struct ClientTiles {
 
 } // namespace
 
-std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar) {
+std::array<bool, TileCount> visibleTiles(const SessionState& state) {
     static const std::vector<ClientTiles> clients = {
         {"B", {QuickTile}, {}},
         {"C", {QuickTile, NothingTile}, {}},
@@ -27,17 +27,19 @@ std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunat
     visible.fill(true);
     visible[AlbumTile] = visible[RestartTile] = visible[OtherTile] = false;
     for (const ClientTiles& client : clients) {
-        if (clientLetter != QLatin1String(client.letter))
+        if (state.profile.ClientLetter != QLatin1String(client.letter))
             continue;
         for (const TileIndex tile : client.hidden)
             visible[tile] = false;
         for (const TileIndex tile : client.shown)
             visible[tile] = true;
     }
-    if (tmunatPaar == 1)
+    if (state.TmunatPaar == 1)
         visible[RestartTile] = true;
-    if (minuyPaar == 2)
+    if (state.MinuyPaar == 2)
         visible[QuickTile] = false;
+    if (state.Careful)
+        visible[NothingTile] = false;
     return visible;
 }
 

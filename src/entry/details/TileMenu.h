@@ -24,8 +24,9 @@ enum TileIndex {
 };
 
 // Which tiles a client sees, by its letter; a letter that is not known has all the ordinary tiles. Then the switches:
-// TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away.
-std::array<bool, TileCount> visibleTiles(const QString& clientLetter, int tmunatPaar, int minuyPaar);
+// TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away, and with Careful the tile that does
+// nothing is gone.
+std::array<bool, TileCount> visibleTiles(const SessionState& state);
 
 // The kind of order that the tile begins, or the mode that it leaves in Optint; NotChosen for the others.
 OrderKind orderKindOf(int tile);

@@ -2,12 +2,15 @@
 
 #include "common/FixedText.h"
 #include "entry/details/DetailStore.h"
+#include "entry/details/RememberedDetails.h"
 #include "entry/details/TileMenu.h"
 #include "entry/details/VolumeMark.h"
 #include "entry/notice/Havharot.h"
+#include "order/CouponLimit.h"
 #include "order/HistoryState.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
+#include "order/TailTelephone.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/files/Drives.h"
@@ -82,8 +85,7 @@ void nnn::takeTile(int tile) {
         startAgain();
         break;
     case EnglishTile:
-        m_state.EnglishTips = 1;
-        setTexts();
+        turnTo(Language::English);
         break;
     case OtherTile:
         showOtherPage();
@@ -92,6 +94,11 @@ void nnn::takeTile(int tile) {
         break;
     }
     Q_EMIT changed();
+}
+
+void nnn::turnTo(Language language) {
+    m_state.EnglishTips = language == Language::English ? 1 : 0;
+    setTexts();
 }
 
 // Does what all tiles have in common. False when the workspace could not be made; the customer has been told.
@@ -165,6 +172,7 @@ void nnn::clearChoices() {
     Option4.checked = Option5.checked = Check1.checked = false;
     m_termsHint = true;
     Label4kpn.visible = false;
+    CouponLimit(m_state).begin();
     m_album.close();
     fillSizes();
 }
@@ -197,6 +205,8 @@ void nnn::recallDetails() {
     }
     Text2.text = (*stored)->name;
     Text3.text = (*stored)->telephone;
+    if (!telephoneMayBe())
+        return;
     Command12.enabled = false;
     open(Step::Options);
 }
@@ -209,20 +219,25 @@ void nnn::leaveDetails() {
         focusOn(problem->place == DetailsProblem::Place::Name ? u"Text2"_s : u"Text4"_s);
         return;
     }
+    if (!telephoneMayBe())
+        return;
     open(Step::Options);
-    saveDetails();
+    // The order goes on even if the details can't be stored.
+    succeeded(RememberedDetails(m_state, m_platform.files).typed({Text2.text, Text3.text}, Check2.checked));
 }
 
-// The order goes on even if the details can't be stored.
-void nnn::saveDetails() {
-    succeeded(DetailStore(m_state, m_platform.files).SaveDetails({Text2.text, Text3.text}));
+// A question's loop may close the page.
+bool nnn::telephoneMayBe() {
+    const bool fits = TailTelephone(m_state).mayBe(Text3.text, m_platform.dialogs);
+    if (m_leaving || m_chain.hasEnded())
+        return false;
+    if (!fits)
+        focusOn(u"Text3"_s);
+    return fits;
 }
 
 void nnn::rememberOrForget() {
-    if (Check2.checked)
-        saveDetails();
-    else
-        succeeded(DetailStore(m_state, m_platform.files).forgetDetails());
+    succeeded(RememberedDetails(m_state, m_platform.files).ordered({Text2.text, Text3.text}, Check2.checked));
 }
 
 // --- paper, border, fit ---
@@ -241,15 +256,10 @@ void nnn::takeQuickSize(int index) {
         return;
     const QString size = m_quickSizes[static_cast<std::size_t>(index)].trimmed();
     checkOnly(Option1, index);
-    CouponState& coupon = m_state.coupon;
-    if (size == u"10/15" || size == u"20/30") {
-        coupon.MisparKoopon = size == u"10/15" ? coupon.SmallCount : coupon.LargeCount;
-        Label4kpn.text = QString::number(coupon.MisparKoopon);
-        Label4kpn.visible = coupon.MisparKoopon > 0;
-    }
     Combo1.rows.setCurrentIndex(-1);
     Combo1.text = size;
     m_state.shemot.ppr = size;
+    showCoupon(CouponLimit(m_state).takeQuickSize(size));
     showStep();
 }
 
@@ -258,7 +268,18 @@ void nnn::takeListedSize(int row) {
         return;
     checkOnly(Option1, -1);
     m_state.shemot.ppr = Combo1.text.trimmed();
+    showCoupon(CouponLimit(m_state).takeListedSize());
     showStep();
+}
+
+void nnn::showCoupon(std::optional<int> limit) {
+    if (!limit)
+        return;
+    Label4kpn.text = QString::number(*limit);
+    Label4kpn.visible = *limit > 0;
+    if (*limit == 0 && m_state.coupon.HaKoopon == 1)
+        tell(u"הקופון תקף רק לגדלים 10/15 ו-20/30 שעל הכרטיסים.\nלגודל שבחרת אין קופון.",
+             u"The coupon is good for the sizes 10/15 and 20/30 on the cards.\nThe size you chose has none.");
 }
 
 void nnn::takePaperKind(int index) {

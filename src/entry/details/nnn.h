@@ -7,6 +7,8 @@
 #include "platform/Platform.h"
 #include "session/Page.h"
 
+#include <optional>
+
 namespace lumora {
 
 class PageChain;
@@ -57,6 +59,7 @@ public:
     void Command7_Click() { cleanHistory(); }
     void Command9_Click() { askToClean(false); }
     void Command15_Click() { showNotice(); }
+    void Command4Ivrit_Click() { turnTo(Language::Hebrew); }
 
     // Called by nothing: nnnUnused.cpp.
     void QuickCheck();
@@ -88,6 +91,8 @@ private:
     QString choiceSoFar() const;
 
     void takeTile(int tile);
+    enum class Language { Hebrew, English };
+    void turnTo(Language language);
     bool beginOrder();
     void beginPrints(int tile);
     void beginAlbum();
@@ -101,13 +106,14 @@ private:
     void tick(CheckCaption& box, bool checked);
     void recallDetails();
     void leaveDetails();
-    void saveDetails();
+    bool telephoneMayBe();
     void rememberOrForget();
     void fillSizes();
     QString sizesPrompt() const;
     QString paperKind(int index) const; // of Option3
     void takeQuickSize(int index);
     void takeListedSize(int row);
+    void showCoupon(std::optional<int> limit);
     void takePaperKind(int index);
     void keepPaperKind();
     void takeBorder(int index);

@@ -15,6 +15,7 @@ struct nnnControls : Controls {
 
     // The menu.
     ControlArray<Caption, 10> Image1{*this, u"Image1"};    // tiles, with a line of explanation as hint
+    Caption Command4Ivrit{*this, u"Command4Ivrit"};        // the way back to Hebrew, in English
     int markedTile = -1;                                   // of the tiles 0 to 2
     Caption Command14{*this, u"Command14"};                // asks whether to clean the history
     Caption Command15{*this, u"Command15"};                // clarifications and warnings

@@ -93,9 +93,10 @@ void nnn::showStep() {
     }
     const bool menu = m_step == Step::Menu;
     const bool options = m_step == Step::Options;
-    const auto tiles = visibleTiles(m_state.profile.ClientLetter, m_state.TmunatPaar, m_state.MinuyPaar);
+    const auto tiles = visibleTiles(m_state);
     for (std::size_t i = 0; i < Image1.size(); ++i)
         Image1[i].visible = menu && tiles[i];
+    Command4Ivrit.visible = menu && m_state.english();
     Command14.visible = menu && m_state.MinuyPaar != 2;
     Command2.visible = Command4.visible = !menu;
     Command7.visible = Command9.visible = Frame1.visible;

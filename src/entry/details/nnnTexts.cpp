@@ -91,6 +91,7 @@ void nnn::setTexts() {
                               u"Tick the box before you go on to the pictures"},
                              {Label8, u"V  V  V", u"V  V  V"},
 
+                             {Command4Ivrit, u"עברית", u"עברית"},
                              {Command14, u"ניקיון היסטוריה", u"Clean the history"},
                              {Command15, u"הבהרות ואזהרות", u"Clarifications and warnings"},
                              {Command7, u"נקה", u"Clean"},

@@ -25,19 +25,24 @@ void Havharot::setTexts() {
                                  {Command1, u"חזור", u"Back"},
                              });
     else
-        setCaptions(m_state, {
-                                 {Title, u"הבהרות ואזהרות", u"Clarifications and warnings"},
-                                 {Label1,
-                                  u"התמונות שלכם נקראות בלבד ואינן משתנות.\n"
-                                  u"הזמנה שלא נשלחה נשארת במחשב זה עד שתישלח.\n"
-                                  u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.\n"
-                                  u"למשלוח תמונות בדואר דרושה תוכנת דואר מוגדרת.",
-                                  u"Your pictures are only read and never changed.\n"
-                                  u"An order that was not sent stays on this computer until it is.\n"
-                                  u"Do not pull out a memory card while an order is being prepared.\n"
-                                  u"Sending pictures by mail needs a mail program that is set up."},
-                                 {Command1, u"המשך", u"Go on"},
-                             });
+        setCaptions(m_state,
+                    {
+                        {Title, u"הבהרות ואזהרות", u"Clarifications and warnings"},
+                        {Label1,
+                         u"התמונות שלכם נקראות בלבד ואינן משתנות.\n"
+                         u"הזמנה שלא נשלחה נשארת במחשב זה עד שתישלח.\n"
+                         u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.\n"
+                         u"משלוח בדואר יוצא דרך שרת הדואר של המעבדה. אין צורך בתוכנת דואר במחשב זה.\n"
+                         u"ניקיון ההיסטוריה מוחק את קבצי ההדפסה של הזמנות קודמות. לאחר מכן לא ניתן לשלוח אותן שוב.\n"
+                         u"דפי ההזמנה, רישומי ההזמנות והתמונות שלכם אינם נמחקים.",
+                         u"Your pictures are only read and never changed.\n"
+                         u"An order that was not sent stays on this computer until it is.\n"
+                         u"Do not pull out a memory card while an order is being prepared.\n"
+                         u"Mail goes by the lab's own mail server. It needs no mail program on this computer.\n"
+                         u"Cleaning the history deletes the print files of earlier orders. They can't be sent "
+                         u"again after that.\nOrder sheets, order logs and your own pictures stay."},
+                        {Command1, u"המשך", u"Go on"},
+                    });
     setCaptions(m_state, {
                              {Command2, u"יציאה", u"Exit"},
                              {Command3, u"בדוק תוכנת דואר", u"Check the mail program"},
@@ -64,9 +69,11 @@ void Havharot::openMailProgram() {
 }
 
 void Havharot::tellHowToSetUpMail() {
-    m_platform.dialogs.message(m_state.wording(
-        u"פתחו את הגדרות המערכת, בחרו יישומי ברירת מחדל,\nוקבעו שם את תוכנת הדואר.",
-        u"Open the system settings, choose the default applications,\nand set the mail program there."));
+    m_platform.dialogs.message(
+        m_state.wording(u"לתוכנה זו אין צורך בתוכנת דואר.\nלשימוש אחר: פתחו את הגדרות המערכת, בחרו יישומי ברירת מחדל,\n"
+                        u"וקבעו שם את תוכנת הדואר.",
+                        u"This program needs no mail program.\nFor other uses open the system settings, choose the "
+                        u"default applications,\nand set the mail program there."));
 }
 
 } // namespace lumora
