@@ -397,6 +397,36 @@ TEST_F(ThePictures, askInTheClosingPanelForWhatTheLabWants) {
     }
 }
 
+TEST_F(ThePictures, areNotHandedOverWithHalfAnAddress) {
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        state.Optint = OrderKind::Print;
+        kyoskNew& page = openWith(1);
+        page.Picture1_Click(0);
+        page.Image7_Click();
+        page.Combo1_Click(2);
+        page.Image7_Click();
+        EXPECT_EQ(page.controls().Combo1.text, careful ? u"walla.com"_s : u"בחר או הקלד"_s) << "behind the way back";
+        page.Combo1_Change({});
+        page.Text1_Change(u"dana"_s);
+        page.Command8_Click();
+        EXPECT_EQ(page.focusBox(), careful ? u"Combo1"_s : QString());
+        page.Text1_Change({});
+        page.Command8_Click();
+        EXPECT_EQ(state.shemot.Mail, careful ? u"לא הוקלד"_s : u"dana@"_s);
+        chain.unload(PageId::Form2);
+
+        state.Optint = OrderKind::Album;
+        kyoskNew& album = openWith(1);
+        album.Picture1_Click(0);
+        album.Image13_Click();
+        album.Txt4Ml2_Change(u"mended@lab.example"_s);
+        album.Command8_Click();
+        EXPECT_EQ(state.shemot.Mail + state.album.MailZalam, u"mended@lab.examplemended@lab.example"_s);
+        chain.unload(PageId::Form2);
+    }
+}
+
 TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     state.coupon.HaKoopon = 1;
     state.coupon.MisparKoopon = 2;
@@ -424,8 +454,22 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     EXPECT_FALSE(shown.Pic4snifim.visible);
     page.Image7_Click();
     page.Command28_Click();
+    // The lab reads Hebrew; a delivery to the home needs an address.
+    state.EnglishTips = 1;
+    state.Careful = true;
+    state.profile.Branches[10].caption = u"משלוח לבית"_s;
+    page.Image7_Click();
+    machine.dialogs.messages.clear();
+    page.Command4Snif_Click(10);
     page.Command8_Click();
-    EXPECT_EQ(state.shemot.Hearot, u" - חיפה"_s);
+    EXPECT_EQ(machine.dialogs.messages.size(), 2);
+    EXPECT_EQ(page.focusBox(), u"Text2"_s);
+    page.Text2_Change(u"5 Herzl, Haifa"_s);
+    state.coupon.MisparKoopon = 0; // of a size without a coupon
+    page.Image7_Click();
+    EXPECT_TRUE(shown.Frame4.visible);
+    page.Command8_Click();
+    EXPECT_EQ(state.shemot.Hearot, u"5 Herzl, Haifa - משלוח לבית"_s);
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "common/FixedText.h"
 #include "editing/editor/tFrmNew.h"
+#include "order/CouponLimit.h"
 #include "order/EditRecord.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -51,8 +52,8 @@ void kyoskNew::load() {
     Image13.visible = m_state.Optint == OrderKind::Album;
     Image7.visible = !Image13.visible;
     const bool coupon = m_state.coupon.HaKoopon == 1;
-    for (Caption* couponOnly : {&Image33, &Command28, &Label4kpn3, &Label4kpn3Prompt})
-        couponOnly->visible = coupon;
+    Image33.visible = Command28.visible = coupon;
+    Label4kpn3.visible = Label4kpn3Prompt.visible = CouponLimit(m_state).measures();
     const AddressBox box = addressBox();
     Text1.visible = Combo1.visible = box == AddressBox::Mail;
     Txt4Ml2.visible = box == AddressBox::AlbumMail;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "order/MailAddressGuard.h"
 #include "platform/files/Files.h"
 #include "selection/FinishRule.h"
 #include "selection/PictureChoice.h"
@@ -84,7 +85,7 @@ public:
     void Command21_Click() { setDeepCompression(true); }
     void Text1_Change(const QString& text) { type(Text1, text); }
     void Text2_Change(const QString& text) { type(Text2, text); }
-    void Txt4Ml2_Change(const QString& text) { type(Txt4Ml2, text); }
+    void Txt4Ml2_Change(const QString& text) { typeAlbumMail(text); }
     void Combo1_Change(const QString& text) { typeDomain(text); }
     void Combo1_Click(int index) { chooseDomain(index); }
     void Command8_Click() { goOnWithAddress(); }
@@ -112,6 +113,8 @@ public:
     // The box that takes the keyboard next; a view moves the focus when the number has changed.
     const QString& focusBox() const { return m_focusBox; }
     int focusRequest() const { return m_focusRequest; }
+    // Combo1 shows its prompt, and what is typed takes its place.
+    bool promptStands() const { return m_promptStands; }
 
 private:
     enum class Guide { None, PicturesShown, ChooseByHand };
@@ -175,10 +178,14 @@ private:
     void chooseBranch(int branch);
     void showBranch(int branch);
     void closeBranches();
+    bool homeAddressKnown();
+    void focusOn(const QString& box);
     void setDeepCompression(bool deep);
     void type(Caption& box, const QString& text) { box.text = text; }
+    void typeAlbumMail(const QString& text);
     void typeDomain(const QString& text);
     void chooseDomain(int index);
+    TypedAddress typedAddress() const;
     void goOnWithAddress();
     void goOnWithoutAddress();
     void handOver(const QString& mail);

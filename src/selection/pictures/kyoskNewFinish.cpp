@@ -1,8 +1,11 @@
 // The page of pictures: the checks at the end of choosing, the closing panel, the hand-over.
 #include "editing/editor/tFrmNew.h"
+#include "order/CouponLimit.h"
+#include "order/MailAddressGuard.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
+#include "selection/HomeAddress.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -11,6 +14,12 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+const QString notTyped = u"לא הוקלד"_s; // the mail address of a customer who gives none
+
+} // namespace
 
 void kyoskNew::finish() {
     openBranches();
@@ -25,9 +34,11 @@ void kyoskNew::finishAlbum() {
 void kyoskNew::checkAndClose() {
     PicB4Sioom.visible = Frame4.visible = false;
     Combo1Items = mailDomains();
-    Combo1Index = -1;
-    m_promptStands = true;
-    Combo1.text = mailDomainPrompt(m_state.english());
+    if (!MailAddressGuard(m_state).keepsDomain(typedAddress())) {
+        Combo1Index = -1;
+        m_promptStands = true;
+        Combo1.text = mailDomainPrompt(m_state.english());
+    }
     if (couponRefuses())
         return;
     const bool mayBeDeep = plain() && (m_state.Optint != OrderKind::Album || m_state.DchisatAlbum);
@@ -40,7 +51,7 @@ void kyoskNew::checkAndClose() {
 }
 
 bool kyoskNew::couponRefuses() {
-    if (m_state.coupon.HaKoopon != 1)
+    if (!CouponLimit(m_state).measures())
         return false;
     const CouponFit fit = checkCoupon(m_state.coupon.MisparKoopon, m_choice.basket().SumCopies());
     if (fit == CouponFit::Matches)
@@ -105,8 +116,26 @@ void kyoskNew::offerBranches() {
 }
 
 void kyoskNew::chooseBranch(int branch) {
-    m_state.BranchChoice = Command4Snif.at(static_cast<std::size_t>(branch)).text;
+    // The lab reads the Hebrew name of home delivery in both languages.
+    m_state.BranchChoice = m_state.profile.Branches.at(static_cast<std::size_t>(branch)).caption;
     closeBranches();
+    homeAddressKnown();
+}
+
+// Asks for an address to which the prints can go.
+bool kyoskNew::homeAddressKnown() {
+    if (!HomeAddress(m_state).isMissing(Text2.text))
+        return true;
+    say(u"נא להקליד בהערות את הכתובת למשלוח:\nרחוב, מספר ועיר",
+        u"Please type the address for the delivery into the notes:\nstreet, number and town");
+    focusOn(u"Text2"_s);
+    return false;
+}
+
+void kyoskNew::focusOn(const QString& box) {
+    m_focusBox = box;
+    ++m_focusRequest;
+    Q_EMIT changed();
 }
 
 void kyoskNew::showBranch(int branch) {
@@ -139,24 +168,41 @@ void kyoskNew::chooseDomain(int index) {
     Q_EMIT changed();
 }
 
+TypedAddress kyoskNew::typedAddress() const {
+    return {Text1.text, Combo1.text, m_promptStands};
+}
+
 void kyoskNew::goOnWithAddress() {
-    if (!plain() && Text1.text.isEmpty()) {
+    const MailAddressGuard guard(m_state);
+    const TypedAddress typed = typedAddress();
+    const QString address = guard.address(typed);
+    if (!plain() && (Text1.text.isEmpty() || address.isEmpty())) {
         say(u"לא הקלדת כתובת דואר", u"You did not type a mail address");
-        m_focusBox = u"Text1"_s;
-        ++m_focusRequest;
-        Q_EMIT changed();
-        return;
+        return focusOn(u"Text1"_s);
     }
-    handOver(m_state.Optint == OrderKind::Album ? Txt4Ml2.text : Text1.text + u'@' + Combo1.text);
+    if (m_state.Optint == OrderKind::Album)
+        return handOver(Txt4Ml2.text);
+    if (guard.lacksDomain(typed)) {
+        say(u"נא לבחור או להקליד את ספק הדואר,\nאחרי השטרודל",
+            u"Please choose or type the mail provider,\nbehind the at sign");
+        return focusOn(u"Combo1"_s);
+    }
+    handOver(address.isEmpty() ? notTyped : address);
 }
 
 void kyoskNew::goOnWithoutAddress() {
-    handOver(plain() ? u"לא הוקלד"_s : m_state.shemot.Mail);
+    handOver(plain() ? notTyped : m_state.shemot.Mail);
+}
+
+// The sheet and the log of an album have the address as it is corrected here.
+void kyoskNew::typeAlbumMail(const QString& text) {
+    Txt4Ml2.text = text;
+    m_state.album.MailZalam = text.trimmed();
 }
 
 // A second press that arrives while the page yields does nothing.
 void kyoskNew::handOver(const QString& mail) {
-    if (m_handedOver)
+    if (m_handedOver || !homeAddressKnown())
         return;
     m_handedOver = true;
     m_state.shemot.Hearot = Text2.text + u" - "_s + m_state.BranchChoice;
