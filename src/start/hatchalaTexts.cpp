@@ -2,6 +2,7 @@
 #include "platform/Dialogs.h"
 #include "session/CaptionTexts.h"
 #include "session/SessionState.h"
+#include "start/ShopRows.h"
 #include "start/hatchala.h"
 
 #include <QUrl>
@@ -50,12 +51,7 @@ void hatchala::setTexts() {
 
     const int chosen = List1.currentIndex();
     List1.clear();
-    if (m_state.english()) {
-        List1.append({u"* Recieve by Postmail "_s, u"* Get at stor "_s});
-    } else {
-        for (const Shop& shop : m_deployment.profile.Shops)
-            List1.append(u"* "_s + shop.name);
-    }
+    List1.append(ShopRows(m_state, m_deployment).texts());
     List1.setCurrentIndex(chosen);
     showProfile();
     Q_EMIT changed();

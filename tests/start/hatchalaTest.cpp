@@ -73,8 +73,10 @@ TEST_F(hatchalaTest, SwitchesItsWordingAndKeepsTwoRows) {
     page.Check1_Click(true);
     page.Check1_Click(true);
     EXPECT_EQ(page.controls().List1.items(), QStringList({"* Recieve by Postmail ", "* Get at stor "}));
-    page.Check1_Click(false);
-    EXPECT_EQ(page.controls().List1.count(), 2);
+    state.Careful = true;
+    page.Check1_Click(true);
+    EXPECT_EQ(page.controls().List1.items(), QStringList({"* Haifa", "* Yaffo"}))
+        << "the shops that the rows stand for";
 }
 
 TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
@@ -198,16 +200,12 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
         page.Image1_Click();
         EXPECT_TRUE(page.controls().Picture1.visible);
         EXPECT_EQ(state.KodMishloach, u"KUP");
-        state.MishloachHabaita = true;
-        state.shemot.Mail = u"earlier@example.com"_s;
         page.List1_Click(c.row);
         ASSERT_EQ(chain.front()->id(), PageId::nnn);
         EXPECT_EQ(state.KodMishloach, c.code);
         EXPECT_EQ(state.KodMishloachMakor, c.code);
         EXPECT_EQ(state.profile.LabPhone, c.phone);
         EXPECT_EQ(seenByTheDetails, c.seen);
-        EXPECT_FALSE(state.MishloachHabaita);
-        EXPECT_TRUE(state.shemot.Mail.isEmpty());
         chain.unload(PageId::nnn);
     }
 }
@@ -260,12 +258,6 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     EXPECT_EQ(page.controls().List4pices.count(), 21);
     const DrivePath path = u"C:\\2000lumora\\tarvelmond.txt"_path;
     EXPECT_EQ(machine.files.read(path)->size(), 203);
-    const QString text = page.controls().Label5.text;
-    page.Command4_Click();
-    EXPECT_NE(page.controls().Label5.text, text);
-    page.Command6_Click();
-    EXPECT_EQ(page.controls().Label5.text, text);
-
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages, QStringList({"No Server", "No Server 2"}));
     EXPECT_FALSE(machine.files.fileExists(path)) << "the old copy goes before the fetch";
