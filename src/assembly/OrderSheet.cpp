@@ -8,6 +8,8 @@
 #include <QFont>
 #include <QFontMetrics>
 #include <QPainter>
+#include <QTextLayout>
+#include <QTextOption>
 #include <QTransform>
 
 #include <algorithm>
@@ -36,6 +38,7 @@ constexpr PictureSize largestSheet = {1100, 1300};
 
 // Pixels of a 96 dpi screen: 12 and 8 points.
 constexpr int lineFontPixels = 16;
+constexpr int leastFontPixels = 8;
 constexpr int captionFontPixels = 11;
 // Distance of the lines in pixels, independent of the font, so that the seventeen lines of an album end above its
 // pictures.
@@ -52,6 +55,45 @@ QFont sheetFont(int pixels) {
 void drawTextLine(QPainter& painter, int x, int top, const QString& text) {
     painter.setLayoutDirection(Qt::LeftToRight);
     painter.drawText(QPoint(x, top + painter.fontMetrics().ascent()), text);
+}
+
+int widthOf(QString text, const QFont& font) {
+    while (text.endsWith(u' '))
+        text.chop(1);
+    return QFontMetrics(font).horizontalAdvance(text);
+}
+
+// The largest font, from 16 down to 8 pixels, in which the text is no wider than room.
+QFont fittingFont(const QString& text, int room) {
+    int pixels = lineFontPixels;
+    while (pixels > leastFontPixels && widthOf(text, sheetFont(pixels)) > room)
+        --pixels;
+    return sheetFont(pixels);
+}
+
+QStringList brokenToWidth(const QString& text, const QFont& font, int room) {
+    QTextOption option;
+    option.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    option.setTextDirection(Qt::LeftToRight);
+    QTextLayout layout(text, font);
+    layout.setTextOption(option);
+    QStringList pieces;
+    layout.beginLayout();
+    for (QTextLine line = layout.createLine(); line.isValid(); line = layout.createLine()) {
+        line.setLineWidth(room);
+        pieces += text.mid(line.textStart(), line.textLength());
+    }
+    layout.endLayout();
+    return pieces;
+}
+
+QString shortenedToWidth(QString text, const QFont& font, int room) {
+    const QString dots = u"..."_s;
+    while (!text.isEmpty() && widthOf(text + dots, font) > room)
+        text.chop(1);
+    // The dots stand at the end of a Hebrew text, which is its left side.
+    const bool hebrew = !text.isEmpty() && text.back().direction() == QChar::DirR;
+    return text + dots + (hebrew ? u"\u200F"_s : QString());
 }
 
 struct DeliveryPlace {
@@ -118,51 +160,52 @@ QColor orderSheetBackground(SheetKind kind, const SessionState& state) {
     return kind == SheetKind::Album ? QColor(220, 220, 150) : QColor(Qt::white);
 }
 
-QStringList plainSheetLines(const SessionState& state, const QDateTime& now) {
+QList<SheetLine> plainSheetLines(const SessionState& state, const QDateTime& now) {
     const OrderDetails& shemot = state.shemot;
     const QString paper =
         shemot.ppr == mixedSizes
             ? shemot.ppr + u"   paper  Kind"_s + shemot.Soog2 + u' ' + shemot.Soog1
             : u"  Paper size...."_s + shemot.ppr + u"       paper  Kind"_s + shemot.maat + u"    "_s + shemot.FillFit;
-    return {plainTopLine(state, now),    customerLine(shemot), addressLine(shemot), paper,
-            totalLine(shemot, u"   "_s), shemot.Hearot};
+    return {{plainTopLine(state, now)},    {customerLine(shemot)}, {addressLine(shemot)}, {paper},
+            {totalLine(shemot, u"   "_s)}, {shemot.Hearot}};
 }
 
-QStringList editedSheetLines(const SessionState& state, const QDateTime& now) {
+QList<SheetLine> editedSheetLines(const SessionState& state, const QDateTime& now) {
     const OrderDetails& shemot = state.shemot;
-    return {topLine(state, now, deliveryLine(editedPlaces, state.KodMishloach) + u' '),
-            customerLine(shemot),
-            addressLine(shemot),
-            u"  Paper size...."_s + shemot.ppr + u"       paper Kind  "_s + shemot.maat,
-            totalLine(shemot, u"     "_s),
-            u"  "_s + shemot.Hearot};
+    return {{topLine(state, now, deliveryLine(editedPlaces, state.KodMishloach) + u' ')},
+            {customerLine(shemot)},
+            {addressLine(shemot)},
+            {u"  Paper size...."_s + shemot.ppr + u"       paper Kind  "_s + shemot.maat},
+            {totalLine(shemot, u"     "_s)},
+            {u"  "_s + shemot.Hearot}};
 }
 
-QStringList albumSheetLines(const SessionState& state, const QDateTime& now) {
+QList<SheetLine> albumSheetLines(const SessionState& state, const QDateTime& now) {
     const AlbumDetails& album = state.album;
-    const QString rule(89, u'-');
+    const SheetLine rule{QString(89, u'-')};
     const QString gap(7, u' ');
     const auto& extras = album.Tosafot2;
     return {
-        plainTopLine(state, now),
-        u"  ShemZalam...."_s + album.ShemZalam + u"        TelZalam....."_s + album.TelZalam + u"      "_s +
-            state.shemot.n4,
+        {plainTopLine(state, now)},
+        {u"  ShemZalam...."_s + album.ShemZalam + u"        TelZalam....."_s + album.TelZalam + u"      "_s +
+             state.shemot.n4,
+         true},
         // The address is on the line of the event.
-        u"  ShemErooa...."_s + album.ShemErooa + u"    "_s + state.shemot.n3 + u"      "_s,
-        u"  MailZalam...."_s + album.MailZalam,
-        u"  Total pictures..."_s + QString::number(state.shemot.TotalPics),
+        {u"  ShemErooa...."_s + album.ShemErooa + u"    "_s + state.shemot.n3 + u"      "_s, true},
+        {u"  MailZalam...."_s + album.MailZalam},
+        {u"  Total pictures..."_s + QString::number(state.shemot.TotalPics)},
         rule,
-        u"  GodelLBM...."_s + album.GodelLBM + u"       SoogLBM...."_s + album.SoogLBM + u"     SoogNiar...."_s +
-            album.SoogNiar,
-        u"  SoogKricha...."_s + album.SoogKricha,
+        {u"  GodelLBM...."_s + album.GodelLBM + u"       SoogLBM...."_s + album.SoogLBM + u"     SoogNiar...."_s +
+         album.SoogNiar},
+        {u"  SoogKricha...."_s + album.SoogKricha},
         rule,
-        u' ' + extras[0] + gap + extras[1] + gap + extras[2] + gap + extras[3] + u"  "_s,
-        u' ' + extras[4] + gap + extras[5] + gap + extras[6] + gap + extras[7] + gap + extras[8] + u"     "_s,
+        {u' ' + extras[0] + gap + extras[1] + gap + extras[2] + gap + extras[3] + u"  "_s},
+        {u' ' + extras[4] + gap + extras[5] + gap + extras[6] + gap + extras[7] + gap + extras[8] + u"     "_s},
         rule,
-        u' ' + album.KamutHorim + u"  אלבום הורים  "_s,
-        u"   סוג  אלבום  הורים  "_s + album.SoogHorim + u"   "_s,
+        {u' ' + album.KamutHorim + u"  אלבום הורים  "_s, true},
+        {u"   סוג  אלבום  הורים  "_s + album.SoogHorim + u"   "_s, true},
         rule,
-        u"  Hearot...."_s + state.shemot.Hearot,
+        {u"  Hearot...."_s + state.shemot.Hearot, true},
         rule,
     };
 }
@@ -185,32 +228,56 @@ Result<Bitmap> sheetThumbnail(const std::filesystem::path& source) {
 
 OrderSheet::OrderSheet(SheetKind kind, PictureSize size, QColor background)
     : m_kind(kind)
+    , m_size(size)
+    , m_background(background)
     , m_bitmap(size.width, size.height, background) {}
 
-void OrderSheet::drawLines(const QStringList& lines) {
-    QPainter painter(&m_bitmap.image());
-    painter.setFont(sheetFont(lineFontPixels));
-    painter.setPen(Qt::black);
+void OrderSheet::drawLines(const QList<SheetLine>& lines) {
+    struct Placed {
+        QString text;
+        QFont font;
+        int top;
+    };
+    std::vector<Placed> placed;
+    const int room = m_size.width - 2 * textStart.x();
     int top = textStart.y();
-    for (const QString& line : lines) {
+    for (const SheetLine& line : lines) {
         // A break inside a remark starts a line of its own.
-        QString text = line;
-        for (const QString& part : text.remove(u'\r').split(u'\n')) {
-            drawTextLine(painter, textStart.x(), top, part);
-            top += linePitch;
+        for (const QString& part : QString(line.text).remove(u'\r').split(u'\n')) {
+            const QFont font = fittingFont(part, room);
+            QStringList pieces = {part};
+            if (widthOf(part, font) > room)
+                pieces =
+                    line.onlyHere ? brokenToWidth(part, font, room) : QStringList{shortenedToWidth(part, font, room)};
+            const int pitch = QFontMetrics(font).lineSpacing();
+            for (qsizetype i = 0; i < pieces.size(); ++i)
+                placed.push_back({pieces[i], font, top + static_cast<int>(i) * pitch});
+            top += pieces.size() == 1 ? linePitch : std::max(linePitch, static_cast<int>(pieces.size()) * pitch);
         }
+    }
+    m_added = std::max(0, top - firstRowTop());
+    if (m_added > 0)
+        m_bitmap = Bitmap(m_size.width, m_size.height + m_added, m_background);
+    QPainter painter(&m_bitmap.image());
+    painter.setPen(Qt::black);
+    for (const Placed& line : placed) {
+        painter.setFont(line.font);
+        drawTextLine(painter, textStart.x(), line.top, line.text);
     }
 }
 
+int OrderSheet::firstRowTop() const {
+    return sheetCellSize + (m_kind == SheetKind::Album ? 282 : 81) + m_added;
+}
+
 int OrderSheet::capacity() const {
-    const int lastRow = m_bitmap.height() / sheetCellSize - 1;
-    const int lastColumn = m_bitmap.width() / sheetCellSize - 2;
+    const int lastRow = m_size.height / sheetCellSize - 1;
+    const int lastColumn = m_size.width / sheetCellSize - 2;
     return lastRow * (lastColumn + 1);
 }
 
 void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after) {
-    const int columns = m_bitmap.width() / sheetCellSize - 1;
-    const int sheetTop = m_kind == SheetKind::Album ? 282 : 81;
+    const int columns = m_size.width / sheetCellSize - 1;
     const int count = std::min(capacity(), static_cast<int>(cells.size()));
     WorkAhead<Result<Bitmap>> thumbnails(count, [&cells](int i) -> WorkAhead<Result<Bitmap>>::Work {
         const auto source = cells[static_cast<std::size_t>(i)].source;
@@ -222,7 +289,7 @@ void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const std
         bool wanted = true;
         const Result<Bitmap> picture = thumbnails.take([&] { wanted = wanted && after(i); });
         if (wanted && picture) {
-            const QPoint at((sheetCellSize + 2) * (i % columns) + 5, sheetCellSize * (1 + i / columns) + sheetTop);
+            const QPoint at((sheetCellSize + 2) * (i % columns) + 5, firstRowTop() + sheetCellSize * (i / columns));
             QPainter painter(&m_bitmap.image());
             painter.drawImage(at, picture->image());
             painter.setFont(sheetFont(captionFontPixels));

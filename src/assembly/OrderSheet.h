@@ -5,7 +5,8 @@
 #include "imaging/files/PictureFile.h"
 
 #include <QDateTime>
-#include <QStringList>
+#include <QList>
+#include <QString>
 
 #include <filesystem>
 #include <functional>
@@ -26,10 +27,15 @@ PictureSize orderSheetSize(SheetKind kind, int items);
 
 QColor orderSheetBackground(SheetKind kind, const SessionState& state);
 
+struct SheetLine {
+    QString text;
+    bool onlyHere = false; // the order log lacks it: it is broken into several lines, never shortened
+};
+
 // The lines of text from the top, blanks included.
-QStringList plainSheetLines(const SessionState& state, const QDateTime& now);
-QStringList editedSheetLines(const SessionState& state, const QDateTime& now);
-QStringList albumSheetLines(const SessionState& state, const QDateTime& now);
+QList<SheetLine> plainSheetLines(const SessionState& state, const QDateTime& now);
+QList<SheetLine> editedSheetLines(const SessionState& state, const QDateTime& now);
+QList<SheetLine> albumSheetLines(const SessionState& state, const QDateTime& now);
 
 // A picture of the contact sheet and the text below it. A cell without a source stays empty.
 struct SheetCell {
@@ -47,7 +53,10 @@ class OrderSheet {
 public:
     OrderSheet(SheetKind kind, PictureSize size, QColor background);
 
-    void drawLines(const QStringList& lines);
+    // A line that is too long is drawn smaller, down to 8 pixels; what is longer still is shortened with "...", or
+    // broken where it is only here. Lines that reach the pictures make the sheet higher. To be called once, before the
+    // pictures.
+    void drawLines(const QList<SheetLine>& lines);
 
     // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, without the cells beyond them
     // and clipped at the bottom of the box. Pictures are read on several threads. after(i) runs on the calling thread
@@ -60,8 +69,13 @@ public:
     const Bitmap& bitmap() const { return m_bitmap; }
 
 private:
+    int firstRowTop() const;
+
     SheetKind m_kind;
+    PictureSize m_size; // by the number of pictures
+    QColor m_background;
     Bitmap m_bitmap;
+    int m_added = 0; // pixels by which long lines have moved the pictures down
 };
 
 } // namespace lumora

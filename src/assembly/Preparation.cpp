@@ -166,7 +166,7 @@ void Preparation::notWritten(const Failure& failure) {
         m_events.notWritten(PreparationEvents::NotWritten::File, failure);
 }
 
-std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& lines, const QStringList& texts,
+std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& lines, const QList<SheetLine>& texts,
                                              const std::vector<SheetCell>& cells) {
     OrderSheet sheet(kind, orderSheetSize(kind, static_cast<int>(lines.size())), orderSheetBackground(kind, m_state));
     sheet.drawLines(texts);

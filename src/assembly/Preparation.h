@@ -80,7 +80,7 @@ protected:
     // Tells of what is kept for going on with the order: it can be sent without.
     void keep(const Result<void>& written);
     // No value when a click ended the program.
-    std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines, const QStringList& texts,
+    std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines, const QList<SheetLine>& texts,
                                     const std::vector<SheetCell>& cells);
     // Writes the next order's number.
     void countOrder();

@@ -10,8 +10,15 @@
 namespace lumora {
 namespace {
 
+QStringList textsOf(const QList<SheetLine>& lines) {
+    QStringList texts;
+    std::transform(lines.begin(), lines.end(), std::back_inserter(texts),
+                   [](const SheetLine& line) { return line.text; });
+    return texts;
+}
+
 QStringList linesOf(SessionState& state) {
-    return plainSheetLines(state, FixedClock().now());
+    return textsOf(plainSheetLines(state, FixedClock().now()));
 }
 
 SessionState deliveredOrder() {
@@ -53,7 +60,7 @@ TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
         u"  Total pictures...13   Border=  NB     Mail  dana@example.com"_s,
         u"  gift - "_s,
     };
-    EXPECT_EQ(editedSheetLines(state, FixedClock().now()), wanted);
+    EXPECT_EQ(textsOf(editedSheetLines(state, FixedClock().now())), wanted);
     state.shemot.ppr = u"zz/zz"_s;
     EXPECT_EQ(orderSheetBackground(SheetKind::Edited, state), QColor(Qt::white));
 }
@@ -74,7 +81,7 @@ TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
     album.SoogHorim = u"30/60"_s;
     const QString rule(89, u'-');
     // The event and the address share a line.
-    EXPECT_EQ(albumSheetLines(state, FixedClock().now()),
+    EXPECT_EQ(textsOf(albumSheetLines(state, FixedClock().now())),
               (QStringList{
                   u"No.....105_1234    21/11/2026 14:05:09      ver: 4.00"_s,
                   u"  ShemZalam....Studio Or        TelZalam.....03-7654321      "_s,
@@ -146,21 +153,30 @@ TEST_F(ContactSheet, endsWithItsLastCellAndWhereItIsToldTo) {
     }
 }
 
-TEST_F(ContactSheet, writesTheLinesAboveThePictures) {
-    SessionState state = deliveredOrder();
-    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
-    const QImage empty = sheet.bitmap().image();
-    sheet.drawLines(linesOf(state));
-    EXPECT_NE(sheet.bitmap().image().copy(0, 10, 500, 20), empty.copy(0, 10, 500, 20));
-    EXPECT_EQ(sheet.bitmap().image().copy(0, 0, 500, 8), empty.copy(0, 0, 500, 8));
-    EXPECT_EQ(sheet.bitmap().image().copy(0, 161, 500, 300), empty.copy(0, 161, 500, 300))
-        << "six lines end above the pictures";
-
-    OrderSheet album(SheetKind::Album, {500, 480}, Qt::white);
-    album.drawLines(albumSheetLines(state, QDateTime()));
-    EXPECT_NE(album.bitmap().image().copy(0, 330, 500, 20), empty.copy(0, 330, 500, 20));
-    EXPECT_EQ(album.bitmap().image().copy(0, 362, 500, 100), empty.copy(0, 362, 500, 100))
-        << "and so do an album's seventeen";
+TEST_F(ContactSheet, showsEachLineWholeAboveThePictures) {
+    for (const auto& [kind, words] : {std::pair(SheetKind::Plain, 0),
+                                      {SheetKind::Plain, 15},
+                                      {SheetKind::Plain, 400},
+                                      {SheetKind::Edited, 400},
+                                      {SheetKind::Album, 15},
+                                      {SheetKind::Album, 400}}) {
+        SessionState state = deliveredOrder();
+        state.shemot.Hearot = u"הערה "_s.repeated(words);
+        OrderSheet sheet(kind, {500, 480}, Qt::white);
+        sheet.drawLines(kind == SheetKind::Album    ? albumSheetLines(state, QDateTime())
+                        : kind == SheetKind::Edited ? editedSheetLines(state, QDateTime())
+                                                    : plainSheetLines(state, QDateTime()));
+        const QImage text = sheet.bitmap().image();
+        const QImage empty = Bitmap(500, text.height(), Qt::white).image();
+        const int added = text.height() - 480;
+        const int firstRow = added + (kind == SheetKind::Album ? 362 : 161);
+        EXPECT_NE(text.copy(0, 10, 500, 20), empty.copy(0, 10, 500, 20));
+        EXPECT_EQ(text.copy(499, 0, 1, text.height()), empty.copy(499, 0, 1, text.height())) << "cut at the side";
+        EXPECT_EQ(text.copy(0, firstRow, 500, 300), empty.copy(0, firstRow, 500, 300)) << "below the first picture";
+        EXPECT_EQ(added > 0, kind == SheetKind::Album && words == 400) << "only an album's log lacks the note";
+        sheet.drawContactSheet({picture("land", 400, 300)}, [](int) { return true; });
+        EXPECT_TRUE(isRed(sheet.bitmap().image().pixelColor(15, firstRow + 30)));
+    }
 }
 
 } // namespace
