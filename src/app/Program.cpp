@@ -60,6 +60,10 @@ struct Program::Parts {
         , dialogs(window, state, files)
         , platform{files, dialogs, line ? *line : internet, mail, shell, clock, pump, volume, instances} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
+        window.mayEnd = [this] {
+            return dialogs.ask(state.wording(u"לצאת מהתוכנה? הזמנה שעדיין לא נשלחה לא תישמר.",
+                                             u"Leave the program? An order that was not sent yet is lost."));
+        };
     }
 
     Deployment deployment;

@@ -8,6 +8,8 @@
 #include "views/window/ScreenDialogs.h"
 
 #include <QApplication>
+#include <QComboBox>
+#include <QLineEdit>
 #include <QTest>
 #include <QTimer>
 #include <QWidget>
@@ -29,6 +31,12 @@ void tabTo(Walk& walk, const QString& name) {
     for (int i = 0; i < 80 && focusName() != name; ++i)
         walk.key(Qt::Key_Tab);
     ASSERT_EQ(focusName(), name);
+}
+
+void tapAndType(Walk& walk, const QString& name, const QString& words) {
+    QTest::mouseClick(static_cast<QComboBox&>(walk.control(name)).lineEdit(), Qt::LeftButton);
+    walk.settle();
+    text(words);
 }
 
 void press(Walk& walk, const QString& name, Qt::Key code = Qt::Key_Return) {
@@ -78,16 +86,24 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     walk.key(Qt::Key_Plus);
     EXPECT_EQ(pictures.controls().Label7.text.trimmed(), u"3"_s);
     EXPECT_EQ(pictures.controls().List1.count(), 2);
-    press(walk, u"Image10"_s);
-    ASSERT_TRUE(pictures.controls().Frame3.visible);
+    walk.program().window().close();
+    walk.settle();
+    ASSERT_TRUE(pictures.controls().Frame3.visible) << "closing the window asks as the page's exit does";
     walk.key(Qt::Key_Escape);
     EXPECT_FALSE(pictures.controls().Frame3.visible) << "Esc closes the panel";
     press(walk, u"Image7"_s);
     ASSERT_TRUE(pictures.controls().Frame4.visible);
+    tapAndType(walk, u"Combo1"_s, u"lab.example"_s);
+    EXPECT_EQ(pictures.controls().Combo1.text, u"lab.example"_s) << "in place of the prompt";
     press(walk, u"Command7"_s);
     walk.waitFor(u"FtpFrm"_s);
     EXPECT_EQ(walk.program().state().shemot.n1, u"Dana Levi"_s);
     EXPECT_EQ(walk.program().state().shemot.Bord, u"WB"_s);
+    walk.program().chain().show(PageId::SpltForm); // has no exit
+    bool asked = false;
+    walk.program().dialogs().nextAnswer = [&] { return std::optional(!(asked = true)); };
+    walk.program().window().close();
+    EXPECT_TRUE(asked && !walk.program().chain().hasEnded());
 }
 
 TEST(Keyboard, StaysOnACardThatIsTaken) {

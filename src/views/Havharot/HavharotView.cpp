@@ -33,6 +33,11 @@ QWidget* HavharotView::firstFocus() const {
     return m_goOn;
 }
 
+bool HavharotView::leave() {
+    m_page.Command2_Click();
+    return true;
+}
+
 void HavharotView::render() {
     frame().setTitle(m_page.controls().Title.text);
 }

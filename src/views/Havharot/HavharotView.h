@@ -10,6 +10,7 @@ class HavharotView : public ViewOf<Havharot> {
 public:
     HavharotView(Havharot& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override;
+    bool leave() override;
     void escape() override { m_page.Command1_Click(); }
 
 protected:

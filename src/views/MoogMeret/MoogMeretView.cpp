@@ -124,6 +124,11 @@ QWidget* MoogMeretView::firstFocus() const {
     return m_orders;
 }
 
+bool MoogMeretView::leave() {
+    m_page.Command6_Click();
+    return true;
+}
+
 void MoogMeretView::render() {
     if (m_page.phase() == MoogMeret::Phase::Leaving)
         return;

@@ -13,6 +13,7 @@ class MoogMeretView : public ViewOf<MoogMeret> {
 public:
     MoogMeretView(MoogMeret& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override;
+    bool leave() override;
 
 protected:
     void render() override;

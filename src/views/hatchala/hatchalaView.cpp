@@ -241,6 +241,11 @@ void hatchalaView::renderHelp() {
         hint.text->setText(hint.caption->text.trimmed());
 }
 
+bool hatchalaView::leave() {
+    m_page.Image3_MouseDown();
+    return true;
+}
+
 void hatchalaView::render() {
     setDirectedIcon(m_start, Way::Forwards);
     m_start->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight); // the arrow behind the word

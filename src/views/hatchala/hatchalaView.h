@@ -17,6 +17,7 @@ class hatchalaView : public ViewOf<hatchala> {
 public:
     hatchalaView(hatchala& page, const SessionState& state, const Theme& theme, const Files& files);
     QWidget* firstFocus() const override;
+    bool leave() override;
 
 protected:
     void render() override;

@@ -1,7 +1,9 @@
 #include "views/kit/EditableCombo.h"
 
+#include <QEvent>
 #include <QLineEdit>
 #include <QSignalBlocker>
+#include <QTimer>
 
 namespace lumora {
 
@@ -11,11 +13,13 @@ EditableCombo::EditableCombo(QWidget* parent, std::function<void(int)> chosen,
     setEditable(true);
     setInsertPolicy(QComboBox::NoInsert);
     setProperty("ownRing", true); // its border shows the focus
+    lineEdit()->installEventFilter(this);
     connect(this, &QComboBox::activated, this, [chosen = std::move(chosen)](int row) { chosen(row); });
     connect(lineEdit(), &QLineEdit::textEdited, this, [typed = std::move(typed)](const QString& text) { typed(text); });
 }
 
-void EditableCombo::display(const QStringList& rows, int row, const QString& text) {
+void EditableCombo::display(const QStringList& rows, int row, const QString& text, Says says) {
+    m_prompt = says == Says::Prompt ? text : QString();
     const QSignalBlocker quiet(this);
     QStringList shown;
     for (int i = 0; i < count(); ++i)
@@ -29,6 +33,22 @@ void EditableCombo::display(const QStringList& rows, int row, const QString& tex
     const QSignalBlocker quietToo(lineEdit());
     if (currentText() != text)
         setEditText(text);
+}
+
+void EditableCombo::focusInEvent(QFocusEvent* event) {
+    QComboBox::focusInEvent(event);
+    choosePrompt();
+}
+
+bool EditableCombo::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == lineEdit() && event->type() == QEvent::MouseButtonRelease)
+        QTimer::singleShot(0, this, &EditableCombo::choosePrompt); // the release itself places the cursor
+    return QComboBox::eventFilter(watched, event);
+}
+
+void EditableCombo::choosePrompt() {
+    if (!m_prompt.isEmpty() && currentText() == m_prompt)
+        lineEdit()->selectAll();
 }
 
 } // namespace lumora

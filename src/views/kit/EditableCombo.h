@@ -7,12 +7,23 @@
 
 namespace lumora {
 
-// A box that offers rows and takes a typed text too. What a program sets in it calls neither of the two.
+// A box that offers rows and takes a typed text too. What a program sets in it calls neither of the two. A prompt is
+// chosen whole when the box takes the keyboard or is tapped, so that typing replaces it.
 class EditableCombo : public QComboBox {
     Q_OBJECT
 public:
     EditableCombo(QWidget* parent, std::function<void(int)> chosen, std::function<void(const QString&)> typed);
-    void display(const QStringList& rows, int row, const QString& text);
+    enum class Says { Prompt, Choice };
+    void display(const QStringList& rows, int row, const QString& text, Says says);
+
+protected:
+    void focusInEvent(QFocusEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    void choosePrompt();
+
+    QString m_prompt; // empty while the box says something else
 };
 
 } // namespace lumora

@@ -287,7 +287,8 @@ void kyoskNewView::renderClosing() {
     speak(m_domain, c.Combo1.spoken);
     speak(m_albumMail, c.Label17.text.simplified());
     speak(m_note, c.Text2Prompt.text.simplified());
-    m_domain->display(c.Combo1Items, c.Combo1Index, c.Combo1.text);
+    using enum EditableCombo::Says;
+    m_domain->display(c.Combo1Items, c.Combo1Index, c.Combo1.text, m_page.promptStands() ? Prompt : Choice);
     const AddressBox box = m_page.addressBox();
     m_at->setVisible(box == AddressBox::Mail);
     changeRole(m_withoutAddress, box == AddressBox::None ? "main" : "secondary");
@@ -310,6 +311,11 @@ void kyoskNewView::renderFolder() {
         line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().size(Extent::WideField))) +
                u"  ·  "_s + c.pictureCount.text;
     m_folder->setText(line);
+}
+
+bool kyoskNewView::leave() {
+    m_page.Image10_Click();
+    return true;
 }
 
 void kyoskNewView::render() {

@@ -16,6 +16,7 @@ class kyoskNewView : public ViewOf<kyoskNew> {
 public:
     kyoskNewView(kyoskNew& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override;
+    bool leave() override;
     void escape() override;
 
 protected:

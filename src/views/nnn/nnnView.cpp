@@ -192,7 +192,10 @@ QWidget* nnnView::makeTerms() {
 }
 
 void nnnView::makeBars() {
+    QPushButton* hebrew = button(c.Command4Ivrit, Role::Quiet, &nnn::Command4Ivrit_Click, u"globe"_s);
+    hebrew->setProperty("letterOfAnyLanguage", true);
     frame().addHeaderActions({button(c.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
+                              hebrew,
                               button(c.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
     m_back = button(c.Command4, Role::Secondary, &nnn::Command4_Click);
     frame().addSecondaryActions({m_back, button(c.Command2, Role::Quiet, &nnn::Command2_Click),
@@ -235,6 +238,11 @@ QWidget* nnnView::firstFocus() const {
 
 void nnnView::escape() {
     m_page.Command4_Click();
+}
+
+bool nnnView::leave() {
+    m_page.Image1_Click(ExitTile);
+    return true;
 }
 
 void nnnView::render() {

@@ -19,6 +19,7 @@ public:
     nnnView(nnn& page, const SessionState& state, const Theme& theme);
     ~nnnView() override;
     QWidget* firstFocus() const override;
+    bool leave() override;
     void escape() override;
 
 protected:

@@ -188,7 +188,9 @@ void nnnView::Album::render() {
     for (std::size_t i = 0; i < m_boxes.size(); ++i)
         m_view.speak(m_boxes[i], m_shown.LabelText1[i].text);
     m_view.speak(m_domain, m_shown.LabelCombo4Mail.text);
-    m_domain->display(m_shown.Combo4Mail.rows.items(), m_shown.Combo4Mail.rows.currentIndex(), m_shown.Combo4Mail.text);
+    using enum EditableCombo::Says;
+    m_domain->display(m_shown.Combo4Mail.rows.items(), m_shown.Combo4Mail.rows.currentIndex(), m_shown.Combo4Mail.text,
+                      m_album.promptStands() ? Prompt : Choice);
     for (std::size_t i = 0; i < m_kinds.size(); ++i) {
         const AlbumControls::Shade shade = m_shown.SoogAlb[i].shade;
         m_kinds[i]->setRibbon({shade.red, shade.green, shade.blue});

@@ -30,6 +30,11 @@ B3View::B3View(B3& page, const SessionState& state, const Theme& theme)
     start();
 }
 
+bool B3View::leave() {
+    m_page.Command7_Click();
+    return true;
+}
+
 void B3View::render() {
     PreparationView::render();
     m_picture->setPicture(c.Picture3.image());

@@ -10,6 +10,7 @@ class B3View : public ViewOf<B3, PreparationView> {
 public:
     B3View(B3& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override { return m_start; }
+    bool leave() override;
 
 protected:
     void render() override;

@@ -33,6 +33,11 @@ Form2View::Form2View(Form2& page, const SessionState& state, const Theme& theme)
     start();
 }
 
+bool Form2View::leave() {
+    m_page.Command7_Click();
+    return true;
+}
+
 void Form2View::render() {
     PreparationView::render();
     trouble().frame->setVisible(m_page.isTroubleShown());

@@ -10,6 +10,7 @@ class Form2View : public ViewOf<Form2, PreparationView> {
 public:
     Form2View(Form2& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override { return m_start; }
+    bool leave() override;
 
 protected:
     void render() override;

@@ -113,6 +113,11 @@ void FtpFrmView::makeBars() {
                             asMain(SendingButton::SendNow, m_sendNow)});
 }
 
+bool FtpFrmView::leave() {
+    m_page.Image3_Click();
+    return true;
+}
+
 void FtpFrmView::render() {
     SendingView::render();
     m_pause->setVisible(c.Picture1.visible);

@@ -16,6 +16,7 @@ class FtpFrmView : public ViewOf<FtpFrm, SendingView> {
 public:
     FtpFrmView(FtpFrm& page, const SessionState& state, const Theme& theme, const Files& files);
     QWidget* firstFocus() const override { return m_sendNow; }
+    bool leave() override;
 
 protected:
     void render() override;

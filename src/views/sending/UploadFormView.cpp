@@ -103,6 +103,11 @@ void UploadFormView::makeLabArea() {
     m_labArea->whenEscaped(toPage(&UploadForm::Command9_Click));
 }
 
+bool UploadFormView::leave() {
+    m_page.Image3_Click();
+    return true;
+}
+
 void UploadFormView::render() {
     SendingView::render();
     m_count->setVisible(c.Pic4Timer.visible);

@@ -12,6 +12,7 @@ class UploadFormView : public ViewOf<UploadForm, SendingView> {
 public:
     UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme);
     QWidget* firstFocus() const override { return m_stop; }
+    bool leave() override;
 
 protected:
     void render() override;

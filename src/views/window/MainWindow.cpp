@@ -179,7 +179,13 @@ void MainWindow::rebuild() {
 
 void MainWindow::closeEvent(QCloseEvent* event) {
     event->ignore();
-    m_chain.endProgram();
+    if (m_asking || (m_front && m_front->leave()))
+        return;
+    m_asking = true;
+    const bool ends = !mayEnd || mayEnd();
+    m_asking = false;
+    if (ends)
+        m_chain.endProgram();
 }
 
 } // namespace lumora

@@ -38,6 +38,9 @@ public:
     PageView* viewOf(const Page& page) const;
     const Theme& theme() const { return *m_theme; }
 
+    // Asked where the window is closed on a page without an exit of its own; unset: the program ends.
+    std::function<bool()> mayEnd;
+
     // Renders what waits for the next turn of the event loop, at once.
     void renderNow();
 
@@ -62,6 +65,7 @@ private:
     QStackedLayout* m_stack = nullptr;
     PageView* m_front = nullptr;
     PageView* m_below = nullptr;
+    bool m_asking = false;          // the question whether to end stands
     QPointer<QWidget> m_focusBelow; // what had the keyboard when the panel came
 };
 

@@ -67,6 +67,8 @@ public:
     virtual void setCoveredHeight(int) {}
     // Esc on the page itself.
     virtual void escape() {}
+    // The page's own exit, which asks where it asks; also closing the window comes here. False where the page has none.
+    virtual bool leave() { return false; }
     // What has the keyboard when the page comes to the front.
     virtual QWidget* firstFocus() const { return nullptr; }
 
