@@ -171,19 +171,6 @@ TEST(AFamilyOfPieces, isWholeWithoutAGapAndWithAllThatItsNameDeclaresLessOne) {
     EXPECT_TRUE(PrintsAmong({u"!105_1234_jpp_001_001.prk"_s, u"_001_001.prk"_s, u".prk"_s}).isEmpty());
 }
 
-TEST(AnOrder, isReadFromItsFolder) {
-    TestPlatform test;
-    const OrderFolder folder(u"C:\\2026_11_21_KUP_1234^105"_path);
-    ASSERT_TRUE(test.files.makeFolder(folder.path()));
-    ASSERT_TRUE(test.files.writeWhole(folder.filePath(printName(0)), "x"));
-    EXPECT_EQ(OrderCompleteness::read(test.files, folder, {printName(0)}).named, std::nullopt);
-    ASSERT_TRUE(test.files.writeWhole(folder.logPath(), "rubbish"));
-    EXPECT_EQ(OrderCompleteness::read(test.files, folder, {printName(0)}).named, std::nullopt);
-    ASSERT_TRUE(test.files.writeWhole(folder.logPath(), logOf(OrderLog::Layout::Album, 2, 0).write()));
-    const OrderCompleteness counts = OrderCompleteness::read(test.files, folder, {printName(0)});
-    EXPECT_TRUE(counts.named == 2 && counts.present == 1 && counts.marked == 1);
-}
-
 TEST(AnOrderNumber, belongsToTheFirstThatMakesItsFolder) {
     TestPlatform test;
     SessionState one = exampleOrder();
