@@ -3,7 +3,6 @@ import select
 import shutil
 import socket
 import threading
-import time
 
 from cases import Case, Workspace
 from faults import Fault
@@ -187,18 +186,18 @@ def one_serial_empty_folder(case):
 
 def one_serial_both_ask(case):
     """Both have found no folder when the first file of each arrives."""
-    there, go_on = case.hold('POST', 1)
+    case.send(case.mine)
+    case.make_other(clone=True)
+    both = threading.Barrier(2)
+
+    def act(session):
+        both.wait(100)
+
+    case.web.acts['POST'] = Act(act, 2)
     case.begin(case.mine)
-    there.wait(100)
-    case.make_other(mark=True)
     case.begin(case.other)
-    for _ in range(2000):
-        if len(case.web.puts) > 1:
-            break
-        time.sleep(0.05)
-    go_on.set()
     second = case.other.end()
-    case.judge(case.mine.end(), second)
+    case.judge(case.mine.end(), second, before=1)
 
 
 def cloned(case):
