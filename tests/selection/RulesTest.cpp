@@ -148,8 +148,13 @@ TEST(AChoice, ofAPictureThatStandsInTwoCellsIsOneChoice) {
     for (int i = 0; i < 2; ++i)
         at.choice.addFolder(u"C:\\q"_path, names(1));
     at.choice.nextPage();
-    at.choice.choose(0, QString(EditRecord::newPicture()).replace(15, 3, u"130"_s));
+    const QString edited = QString(EditRecord::newPicture()).replace(15, 3, u"130"_s);
+    EXPECT_EQ(at.choice.storeRecord(u"C:\\q\\01.jpg"_s, edited), -1);
+    at.choice.choose(0, EditRecord::newPicture());
     at.choice.setCopies(0, 5);
+    EXPECT_EQ(at.choice.storeRecord(u"C:\\q\\01.jpg"_s, edited), 0);
+    EXPECT_EQ(at.lines(), QStringList(u"5 1015GNB"_s + edited + u"C:\\q\\01.jpg"_s));
+    EXPECT_EQ(at.choice.recordOf(u"C:\\q\\01.jpg"_s), edited);
     EXPECT_EQ(at.choice.copies(1), 5);
     at.choice.setCopies(1, 0);
     EXPECT_TRUE(at.lines().isEmpty() && !at.choice.chosen(0));
@@ -208,20 +213,6 @@ TEST(AChoice, showsThePagesThatWereSeen) {
         EXPECT_EQ(at.choice.page().count(), c.count) << c.careful << c.presses;
         EXPECT_EQ(at.choice.hasNextPage(), !c.careful || at.choice.path(c.count - 1) != u"C:\\p\\40.jpg"_s);
     }
-}
-
-TEST(AChoice, carriesTheRecordOfAPictureWhateverPageIsInView) {
-    Choosing at(LineForm::Full);
-    const QString edited = QString(EditRecord::newPicture()).replace(15, 3, u"130"_s);
-    EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), -1);
-    at.choice.choose(4, EditRecord::newPicture());
-    at.choice.choose(0, EditRecord::newPicture());
-    at.choice.setCopies(0, 2);
-    at.choice.nextPage();
-    EXPECT_EQ(at.choice.storeRecord(u"C:\\p\\01.jpg"_s, edited), 1);
-    EXPECT_EQ(at.lines().last(), u"2 1015GNB"_s + edited + u"C:\\p\\01.jpg"_s);
-    EXPECT_EQ(at.choice.recordOf(u"C:\\p\\01.jpg"_s), edited);
-    EXPECT_EQ(at.choice.recordOf(u"C:\\p\\02.jpg"_s), std::nullopt);
 }
 
 TEST(APrintGrade, goesByThePixelCountAlone) {
