@@ -12,10 +12,10 @@
 #include "imaging/files/BmpFile.h"
 #include "order/EditRecord.h"
 #include "platform/QtEventPump.h"
+#include "samples/SamplePhotographs.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "support/SamplePhotographs.h"
 #include "support/TestPlatform.h"
 
 #include <QFile>

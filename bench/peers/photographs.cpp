@@ -1,5 +1,5 @@
 #include "common/HostFile.h"
-#include "support/SamplePhotographs.h"
+#include "samples/SamplePhotographs.h"
 
 #include <cstdio>
 #include <cstdlib>

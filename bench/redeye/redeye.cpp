@@ -5,9 +5,9 @@
 #include "Timing.h"
 #include "common/HostFile.h"
 #include "editing/redeye/RedI.h"
+#include "samples/SamplePhotographs.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "support/SamplePhotographs.h"
 #include "support/TestPlatform.h"
 
 #include <QGuiApplication>

@@ -3,7 +3,7 @@
 #include "Floor.h"
 #include "imaging/files/JpegWriter.h"
 #include "imaging/scaling/Resample.h"
-#include "support/SamplePhotographs.h"
+#include "samples/SamplePhotographs.h"
 
 #include <QTemporaryDir>
 

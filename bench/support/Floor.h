@@ -1,7 +1,7 @@
 #pragma once
 
 #include "imaging/files/JpegReader.h"
-#include "support/ReferenceScaling.h"
+#include "samples/ReferenceScaling.h"
 
 #include <QByteArray>
 

@@ -1,6 +1,6 @@
 #include "Portrait.h"
 
-#include "support/SamplePhotographs.h"
+#include "samples/SamplePhotographs.h"
 
 #include <cstdio>
 #include <cstdlib>

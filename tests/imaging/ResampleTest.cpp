@@ -4,8 +4,8 @@
 #include "common/HostFile.h"
 #include "imaging/drawing/Drawing.h"
 #include "imaging/scaling/PlaneScaler.h"
-#include "support/ReferenceScaling.h"
-#include "support/SamplePhotographs.h"
+#include "samples/ReferenceScaling.h"
+#include "samples/SamplePhotographs.h"
 
 #include <QTemporaryDir>
 

@@ -5,9 +5,9 @@
 #include "imaging/files/PictureFile.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
+#include "samples/SamplePhotographs.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "support/SamplePhotographs.h"
 #include "views/window/MainWindow.h"
 
 #include <QPainter>

@@ -1,4 +1,4 @@
-#include "support/SamplePhotographs.h"
+#include "samples/SamplePhotographs.h"
 
 #include "common/HostFile.h"
 

@@ -1,4 +1,4 @@
-#include "support/ReferenceScaling.h"
+#include "samples/ReferenceScaling.h"
 
 #include <algorithm>
 #include <cmath>
