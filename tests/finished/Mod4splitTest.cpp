@@ -1,8 +1,8 @@
 #include "finished/pieces/Mod4split.h"
 
 #include "order/PieceName.h"
+#include "support/PageRig.h"
 #include "support/SmallDisk.h"
-#include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
 
@@ -20,31 +20,20 @@ QByteArray bytesOf(qsizetype length) {
     return bytes;
 }
 
-struct Mod4splitTest : ::testing::Test {
-    TestPlatform test;
+struct Mod4splitTest : ::testing::Test, PageRig {
     bool goOn = true;
-    Mod4split pieces{test.files, [this](int, int) { return goOn; }};
+    Mod4split pieces{machine.files, [this](int, int) { return goOn; }};
 
-    Mod4splitTest() {
-        for (const char* folder : {"C:\\order", "C:\\order\\meforakim"})
-            (void)test.files.makeFolder(DrivePath(QString::fromLatin1(folder)));
-    }
+    Mod4splitTest() { makeFolder(u"C:\\order\\meforakim"_s); }
     static DrivePath source() { return u"C:\\order\\02a.jpp"_path; }
     static DrivePath piece(const char* numbers) {
         return u"C:\\order\\meforakim"_path / u"02a_jpp_%1.prk"_s.arg(QLatin1StringView(numbers));
     }
     static DrivePath whole() { return u"C:\\order\\meforakim\\moorkavim\\02a.jpp"_path; }
-    void write(const DrivePath& path, const QByteArray& bytes) {
-        ASSERT_TRUE(test.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
-    }
     Cut cut(const QString& segment) {
         return pieces.SplitFile(source(), segment, Mod4split::Target::Meforakim, u"jpp"_s);
     }
-    QByteArray read(const DrivePath& path) const {
-        const auto bytes = test.files.read(path);
-        return bytes ? *bytes : QByteArrayLiteral("can't be read");
-    }
-    QStringList cutNames() const { return test.files.names(u"C:\\order\\meforakim"_path, {u'*'}); }
+    QStringList cutNames() const { return machine.files.names(u"C:\\order\\meforakim"_path, {u'*'}); }
 };
 
 // Each length up to three segments, and a file of 105 pieces that no buffer holds whole.
@@ -54,7 +43,7 @@ TEST_F(Mod4splitTest, CuttingAndJoiningGivesTheSameBytesForEveryLength) {
             length = 40 << 20;
         const qsizetype segment = length > 22 ? 400000 : 7;
         SCOPED_TRACE(length);
-        std::filesystem::remove_all(*test.drives.toHost(u"C:\\order\\meforakim"_path));
+        std::filesystem::remove_all(host(u"C:\\order\\meforakim"_path));
         const QByteArray bytes = bytesOf(length);
         write(source(), bytes);
         const Cut made = cut(QString::number(segment));
@@ -74,7 +63,7 @@ TEST_F(Mod4splitTest, CuttingAndJoiningGivesTheSameBytesForEveryLength) {
 }
 
 TEST_F(Mod4splitTest, AnOldPieceKeepsItsTailAndAnOldJoinedFileDoesNot) {
-    ASSERT_TRUE(test.files.makeFolder(u"C:\\order\\meforakim\\moorkavim"_path).ok());
+    makeFolder(u"C:\\order\\meforakim\\moorkavim"_path);
     write(piece("002_002"), "0123456789");
     write(whole(), QByteArray(100, 'o'));
     write(source(), "abcdefg");
@@ -98,15 +87,15 @@ TEST_F(Mod4splitTest, AJoinStopsAtTheFirstGapAndTellsHowFarItCame) {
 TEST_F(Mod4splitTest, AStopLeavesWholePiecesAndNoJoinedFile) {
     write(source(), bytesOf(100));
     int steps = 0;
-    const Mod4split stopped(test.files, [&](int, int) { return ++steps % 3 != 0; });
+    const Mod4split stopped(machine.files, [&](int, int) { return ++steps % 3 != 0; });
     const Cut made = stopped.SplitFile(source(), u"10"_s, Mod4split::Target::Meforakim, u"jpp"_s);
     EXPECT_TRUE(made.stopped);
     EXPECT_EQ(made.pieces, 2);
     EXPECT_EQ(cutNames().size(), 2);
     ASSERT_FALSE(cut(u"10"_s).failure);
     EXPECT_TRUE(stopped.MergeFamily(piece("001_011")).stopped);
-    EXPECT_FALSE(test.files.fileExists(whole()));
-    EXPECT_EQ(test.files.collect(u"C:\\order"_path, Files::Depth::WithSubfolders).size(), 11);
+    EXPECT_FALSE(machine.files.fileExists(whole()));
+    EXPECT_EQ(machine.files.collect(u"C:\\order"_path, Files::Depth::WithSubfolders).size(), 11);
 }
 
 TEST_F(Mod4splitTest, WhatCanNotBeCutIsRefusedAndNothingIsTouched) {
@@ -152,7 +141,7 @@ TEST_F(Mod4splitTest, WhatCanNotBeJoinedIsRefusedAndLeavesNoFolder) {
         EXPECT_TRUE(joined.failure->message.contains(u"C:\\order\\"_s)) << name;
         EXPECT_EQ(joined.file, DrivePath());
     }
-    EXPECT_FALSE(test.files.folderExists(u"C:\\order\\moorkavim"_path));
+    EXPECT_FALSE(machine.files.folderExists(u"C:\\order\\moorkavim"_path));
     // Fewer than 4 characters before the tail leave the base empty.
     write(u"C:\\order\\jpp_001_001.prk"_path, "x");
     EXPECT_EQ(pieces.MergeFamily(u"C:\\order\\jpp_001_001.prk"_path).file, u"C:\\order\\moorkavim\\.jpp"_path);
@@ -162,12 +151,12 @@ TEST_F(Mod4splitTest, AFullDiskLeavesWholePiecesAndTheOldJoinedFile) {
     const SmallDisk disk(64);
     if (!disk.available())
         GTEST_SKIP() << "no right to mount a disk";
-    std::filesystem::create_directory_symlink(disk.path(), *test.drives.toHost(u"C:\\small"_path));
+    std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\small"_path));
     const DrivePath small = u"C:\\small\\02a.jpp"_path;
     const QByteArray bytes = bytesOf(40000);
     write(small, bytes);
     const DrivePath older = u"C:\\small\\moorkavim\\02a.jpp"_path;
-    ASSERT_TRUE(test.files.makeFolder(u"C:\\small\\moorkavim"_path).ok());
+    makeFolder(u"C:\\small\\moorkavim"_path);
     write(older, "the older one");
     const auto leaves = [&] {
         QStringList names;

@@ -7,12 +7,12 @@
 #include "order/OrderFolder.h"
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "support/ExampleOrder.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
+
+#include <tuple>
 
 namespace lumora {
 
@@ -32,7 +32,7 @@ QString leaves(const QStringList& paths) {
 }
 
 // Two orders on the disk, one of them in pieces, and the page over them.
-class FinishedOrders : public ::testing::Test {
+class FinishedOrders : public ::testing::Test, protected PageRig {
 protected:
     static inline const QString orders = u"C:\\2000lumora\\!!000"_s;
     static inline const QString whole = u"2026_11_20_KUP_1234^104"_s;
@@ -40,27 +40,24 @@ protected:
     static QString in(const QString& order, const QString& leaf) { return orders + u'\\' + order + u'\\' + leaf; }
 
     FinishedOrders() {
-        state.DiskRoot = u"C:\\"_path;
         state.shemot.n1 = u"***"_s;
-        for (const QString& folder : {u"C:\\2000lumora"_s, orders, orders + u'\\' + whole, orders + u'\\' + pieces})
-            EXPECT_TRUE(test.files.makeFolder(DrivePath(folder)).ok());
+        makeFolder(DrivePath(orders) / whole);
+        makeFolder(DrivePath(orders) / pieces);
         for (const char* leaf : {"!104_1234.jpp", "02a.jpp", "11b.JPG", "x.txt"})
             write(whole, QString::fromLatin1(leaf));
         ListOutput log;
         log.pair(u"Shemot.n1"_s, u"דנה לוי"_s).pair(u"Shemot.n2"_s, u"03-1234567"_s).pair(u"Shemot.ppr"_s, u"10/15"_s);
-        EXPECT_TRUE(test.files.writeWhole(DrivePath(in(whole, whole + u".txt"_s)), log.bytes()).ok());
+        PageRig::write(DrivePath(in(whole, whole + u".txt"_s)), log.bytes());
         for (const char* leaf :
              {"!105_1234.jpp", "02a_jpp_001_002.prk", "02a_jpp_002_002.prk", "02a.jpp", "kashloo.txt", "z.jpg"})
             write(pieces, QString::fromLatin1(leaf));
         write(pieces, pieces + u".txt"_s);
-        for (const PageId id : {PageId::hatchala, PageId::FtpFrm, PageId::UploadForm, PageId::SpltForm})
-            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
-        chain.registerPage(PageId::MoogMeret,
-                           [this] { return std::make_unique<MoogMeret>(state, test.platform, chain); });
+        registerBare({PageId::hatchala, PageId::FtpFrm, PageId::UploadForm, PageId::SpltForm, PageId::Form2});
+        registerPage<MoogMeret>(PageId::MoogMeret);
     }
 
-    void write(const QString& order, const QString& leaf) {
-        EXPECT_TRUE(test.files.writeWhole(DrivePath(in(order, leaf)), leaf.toUtf8()).ok());
+    void write(const QString& order, const QString& leaf) const {
+        PageRig::write(DrivePath(in(order, leaf)), leaf.toUtf8());
     }
     MoogMeret& start() {
         chain.show(PageId::MoogMeret);
@@ -80,7 +77,7 @@ protected:
         return names.join(u' ').toStdString();
     }
     void tick(const char* time) {
-        test.clock.time = at(time);
+        machine.clock.time = at(time);
         page().Timer3_Tick();
     }
     // Index and minutes of the package in hand, or "over".
@@ -90,10 +87,6 @@ protected:
                          .toStdString()
                    : "over";
     }
-
-    TestPlatform test;
-    SessionState state;
-    PageChain chain{test.pump};
 };
 
 } // namespace
@@ -139,8 +132,8 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
 
 TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     const QString empty = u"2026_11_19_KUP_1234^103"_s;
-    ASSERT_TRUE(test.files.makeFolder(DrivePath(orders + u'\\' + empty)).ok());
-    test.dialogs.answers = {true}; // it has no details, and is looked at all the same
+    makeFolder(DrivePath(orders) / empty);
+    machine.dialogs.answers = {true}; // it has no details, and is looked at all the same
     MoogMeret& page = startWith(empty);
     EXPECT_EQ(page.controls().Label1.text, u"0");
     EXPECT_TRUE(page.controls().Label4Reka.visible);
@@ -148,14 +141,14 @@ TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
     EXPECT_TRUE(page.controls().Picture1.isNull());
     page.Command4_Click();
     page.Command2_Click();
-    EXPECT_EQ(test.dialogs.messages, QStringList({u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"_s,
-                                                  u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s}));
+    EXPECT_EQ(machine.dialogs.messages, QStringList({u"לא בחרת קבצים למשלוח מתוך החלון הצהב\rקרא הנחיות שלב שני"_s,
+                                                     u"לא בחרת קבצים למשלוח מתוך החלון הצהב"_s}));
     EXPECT_TRUE(page.controls().Command4.visible && page.controls().Command2.visible);
     EXPECT_EQ(chain.front(), &page);
 
-    std::filesystem::remove_all(*test.drives.toHost(DrivePath(orders)));
+    std::filesystem::remove_all(host(DrivePath(orders)));
     page.List3_Click(1);
-    EXPECT_TRUE(test.dialogs.messages.last().contains(page.controls().List2.item(1))) << "gone since it was listed";
+    EXPECT_TRUE(machine.dialogs.messages.last().contains(page.controls().List2.item(1))) << "gone since it was listed";
     page.Command5_Click();
     EXPECT_TRUE(page.controls().Label4Rek.visible);
     EXPECT_FALSE(page.controls().Picture2.visible);
@@ -211,20 +204,18 @@ TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
 }
 
 TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked) {
-    chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
     state.profile.JppChunks = 56;
     const QString name = u"2026_11_22_KUP_1234^106"_s;
     const OrderFolder folder{DrivePath(orders) / name};
     const auto give = [&](bool withState, const QStringList& basket) {
-        std::filesystem::create_directories(*test.drives.toHost(folder.path()));
-        EXPECT_TRUE(
-            test.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), examplePrint(state.profile)));
+        makeFolder(folder.path());
+        PageRig::write(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), examplePrint(state.profile));
         OrderState order;
         order.number = u"106"_s;
         order.kind = OrderKind::Print;
         order.items = basket;
         if (withState) {
-            EXPECT_TRUE(WriteOrderState(test.files, folder, order));
+            EXPECT_TRUE(WriteOrderState(machine.files, folder, order));
         }
     };
     const QStringList complete = {u"1 1015GNBC:\\one.jpg"_s};
@@ -249,11 +240,11 @@ TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked)
         MoogMeret& page = start();
         EXPECT_EQ(page.orderRow(name).mark, u"לא הושלמה");
         EXPECT_TRUE(page.orderRow(pieces).mark.isEmpty());
-        test.dialogs.answers = c.answers;
+        machine.dialogs.answers = c.answers;
         page.List3_Click(page.controls().List3.find(name));
-        EXPECT_TRUE(test.dialogs.answers.isEmpty()) << (&c - cases);
+        EXPECT_TRUE(machine.dialogs.answers.isEmpty()) << (&c - cases);
         EXPECT_EQ(chain.front()->id(), c.goesOn ? PageId::Form2 : PageId::MoogMeret) << (&c - cases);
-        EXPECT_EQ(test.files.folderExists(folder.path()), c.there) << (&c - cases);
+        EXPECT_EQ(machine.files.folderExists(folder.path()), c.there) << (&c - cases);
         if (!c.goesOn) {
             EXPECT_EQ(page.phase(), c.picked ? MoogMeret::Phase::Picked : MoogMeret::Phase::Orders);
             EXPECT_EQ(page.controls().List3.count(), c.there ? 3 : 2);
@@ -262,19 +253,19 @@ TEST_F(FinishedOrders, ThatAreNotFinishedAreMarkedAndOfferedBeforeTheyArePicked)
         }
         chain.unload(chain.front()->id());
         chain.unload(PageId::MoogMeret);
-        std::filesystem::remove_all(*test.drives.toHost(folder.path()));
+        std::filesystem::remove_all(host(folder.path()));
     }
     // Prepared again under another number.
     give(true, complete);
     const OrderFolder again(DrivePath(orders) / u"2026_11_22_KUP_1234^107"_s);
-    std::filesystem::create_directories(*test.drives.toHost(again.path()));
+    makeFolder(again.path());
     OrderState order;
     order.replaces = name;
-    ASSERT_TRUE(WriteOrderState(test.files, again, order));
+    ASSERT_TRUE(WriteOrderState(machine.files, again, order));
     MoogMeret& page = start();
     page.List3_Click(page.controls().List3.find(name));
     EXPECT_EQ(page.phase(), MoogMeret::Phase::Orders);
-    EXPECT_TRUE(test.dialogs.messages.last().contains(u"107"_s));
+    EXPECT_TRUE(machine.dialogs.messages.last().contains(u"107"_s));
 }
 
 TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
@@ -293,31 +284,27 @@ TEST_F(FinishedOrders, AnOrderFromThePreparationIsPickedAlready) {
 
 TEST_F(FinishedOrders, AskBeforeASecondRunOfTheProgramGoesOn) {
     for (const bool yes : {true, false}) {
-        const Instances other(test.drives.dataFolder());
-        test.dialogs.answers = {yes};
+        const Instances other(machine.drives.dataFolder());
+        machine.dialogs.answers = {yes};
         start();
-        EXPECT_TRUE(test.dialogs.questions.takeFirst().startsWith(u"Create another instance of this project"));
-        EXPECT_EQ(test.dialogs.questionTitles.takeFirst(), u"Send E-Mail Project");
+        EXPECT_TRUE(machine.dialogs.questions.takeFirst().startsWith(u"Create another instance of this project"));
+        EXPECT_EQ(machine.dialogs.questionTitles.takeFirst(), u"Send E-Mail Project");
         EXPECT_EQ(chain.hasEnded(), !yes);
         chain.unload(PageId::MoogMeret);
     }
 }
 
 TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
-    const HostPath sheet = *test.drives.toHost(DrivePath(in(whole, u"!104_1234.jpp"_s)));
-    struct Case {
-        int width, height;
-        int horizontal, vertical;
-    };
-    const Case cases[] = {{100, 80, 0, 0}, {320, 210, 10, 0}, {4000, 3000, 70, 52}, {100, 1000, 0, 52}};
-    for (const Case& c : cases) {
-        ASSERT_TRUE(saveJpeg(Bitmap(c.width, c.height, Qt::red), sheet, 80).ok());
+    const HostPath sheet = host(DrivePath(in(whole, u"!104_1234.jpp"_s)));
+    for (const auto& [width, height, horizontal, vertical] :
+         {std::tuple(100, 80, 0, 0), {320, 210, 10, 0}, {4000, 3000, 70, 52}, {100, 1000, 0, 52}}) {
+        ASSERT_TRUE(saveJpeg(Bitmap(width, height, Qt::red), sheet, 80).ok());
         MoogMeret& page = startWith(whole);
         EXPECT_FALSE(page.controls().Picture1.isNull());
-        EXPECT_EQ(page.controls().HScroll1.max, c.horizontal) << c.width;
-        EXPECT_EQ(page.controls().VScroll1.max, c.vertical) << c.height;
+        EXPECT_EQ(page.controls().HScroll1.max, horizontal) << width;
+        EXPECT_EQ(page.controls().VScroll1.max, vertical) << height;
         page.VScroll1_Change(9999);
-        EXPECT_EQ(page.controls().VScroll1.value, c.vertical);
+        EXPECT_EQ(page.controls().VScroll1.value, vertical);
     }
     page().List3_Click(1); // begins with a file that is no picture
     EXPECT_TRUE(page().controls().Picture1.isNull());
@@ -326,37 +313,33 @@ TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
 
 TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
     MoogMeret& page = startWith(whole);
-    test.clock.time = at("10:00:59");
+    machine.clock.time = at("10:00:59");
     page.Command2_Click();
     EXPECT_FALSE(page.controls().Command2.visible || page.controls().Command4.visible ||
                  page.controls().Command18.visible);
     EXPECT_TRUE(page.controls().Label24.visible && page.clockRuns());
     EXPECT_EQ(page.controls().Label4Mana.text, u"מנה 1 מתוך 3");
 
-    struct Case {
-        const char* time;
-        const char* walk;
-    };
-    const Case cases[] = {
+    const std::pair<const char*, const char*> cases[] = {
         {"10:00:59", "0 0"}, {"10:01:00", "0 1"}, // a border of a minute, a second later
         {"10:02:59", "0 2"}, {"10:03:00", "0 3"},  {"10:03:01", "1 0"},  {"10:05:59", "1 2"},
         {"10:06:00", "1 3"}, {"10:06:00", "2 0"},  {"09:30:00", "2 0"}, // the clock was set back
         {"09:33:00", "2 3"}, {"09:33:00", "over"}, {"09:50:00", "over"},
     };
-    for (const Case& c : cases) {
-        tick(c.time);
-        EXPECT_EQ(walk(), c.walk) << c.time;
+    for (const auto& [time, stands] : cases) {
+        tick(time);
+        EXPECT_EQ(walk(), stands) << time;
     }
     EXPECT_TRUE(page.controls().Command18.visible && page.controls().Command2.visible &&
                 page.phase() == MoogMeret::Phase::Walked && page.clockRuns());
     EXPECT_FALSE(page.controls().Label24.visible);
     EXPECT_EQ(page.controls().Label4Shaa.text, u"09:50:00") << "the timer runs on";
-    EXPECT_TRUE(test.mail.messages.isEmpty()) << "no mail server is set up";
+    EXPECT_TRUE(machine.mail.messages.isEmpty()) << "no mail server is set up";
 }
 
 TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedThen) {
     MoogMeret& page = startWith(whole);
-    test.clock.time = at("10:00:00");
+    machine.clock.time = at("10:00:00");
     page.Command2_Click();
     tick("10:03:00");
     page.Label13_Click();
@@ -387,85 +370,85 @@ TEST_F(FinishedOrders, AStoppedWalkGoesOnWithWhatIsUnsentWhereTheLabIsCareful) {
     state.profile.mail.host = u"192.0.2.25"_s;
     const QString order = u"2026_11_22_KUP_1234^106"_s;
     const OrderFolder folder{DrivePath(orders) / order};
-    ASSERT_TRUE(test.files.makeFolder(folder.path()));
+    makeFolder(folder.path());
     const QStringList prints = {u"1 1015GNB0000_016F6E65.jpp"_s, u"1 1015GNB0001_016F6E65.jpp"_s,
                                 u"1 1015GNB0002_016F6E65.jpp"_s};
     for (const QString& leaf : prints + QStringList{u"!106_1234.jpp"_s})
         write(order, leaf);
     state.MisparHazmana = u"106"_s;
     const QStringList basket(3, u"1 1015GNBC:\\pics\\one.jpg"_s);
-    ASSERT_TRUE(test.files.writeWhole(
-        folder.logPath(), OrderLog::of(state, OrderLog::Layout::Plain, basket, {}, test.clock.time).write()));
+    PageRig::write(folder.logPath(),
+                   OrderLog::of(state, OrderLog::Layout::Plain, basket, {}, machine.clock.time).write());
     for (const bool careful : {false, true}) {
         state.Careful = careful;
-        test.mail.messages.clear();
+        machine.mail.messages.clear();
         MoogMeret& page = startWith(order);
-        test.clock.time = at("10:00:00");
+        machine.clock.time = at("10:00:00");
         page.Command2_Click();
         for (const char* time : {"10:03:00", "10:03:00"})
             tick(time);
         page.Command19_Click();
-        ASSERT_EQ(test.mail.messages.size(), 2);
-        test.dialogs.answers = {true};
+        ASSERT_EQ(machine.mail.messages.size(), 2);
+        machine.dialogs.answers = {true};
         page.Command2_Click();
         EXPECT_EQ(page.controls().List1.currentIndex(), careful ? 2 : 0);
         for (int minute = 20; page.phase() == MoogMeret::Phase::Walking; minute += 3)
             tick(u"10:%1:00"_s.arg(minute).toLatin1().constData());
-        EXPECT_EQ(test.mail.messages.size(), careful ? 4 : 6);
+        EXPECT_EQ(machine.mail.messages.size(), careful ? 4 : 6);
         EXPECT_TRUE(page.walk().allSent());
-        EXPECT_EQ(ReadOrderState(test.files, folder)->way, OrderState::Way::Mail);
+        EXPECT_EQ(ReadOrderState(machine.files, folder)->way, OrderState::Way::Mail);
         chain.unload(PageId::MoogMeret);
     }
     // Careful: fewer prints than the log names go only if the customer wants it, and none not at all.
-    test.dialogs.answers.clear();
-    test.dialogs.questions.clear();
+    machine.dialogs.answers.clear();
+    machine.dialogs.questions.clear();
     MoogMeret& page = startWith(order);
     page.File1_Click(page.controls().File1.find(prints[0]));
     page.Command2_Click();
-    EXPECT_TRUE(test.dialogs.questions.value(0).contains(u"3")) << "the log's number";
+    EXPECT_TRUE(machine.dialogs.questions.value(0).contains(u"3")) << "the log's number";
     EXPECT_EQ(page.phase(), MoogMeret::Phase::Picked);
     page.Command21_Click();
     page.File1_Click(page.controls().File1.find(u"!106_1234.jpp"_s));
     page.Command2_Click();
-    EXPECT_EQ(test.dialogs.messages.last(), u"אין בהזמנה זו אף תמונה להדפסה, ולכן לא נשלח דבר.");
-    EXPECT_EQ(test.mail.messages.size(), 4);
+    EXPECT_EQ(machine.dialogs.messages.last(), u"אין בהזמנה זו אף תמונה להדפסה, ולכן לא נשלח דבר.");
+    EXPECT_EQ(machine.mail.messages.size(), 4);
 }
 
 TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     state.profile.mail.host = u"192.0.2.25"_s;
-    test.mail.outcomes = {{}, {MailEnd::NoContact, u"no route"_s}};
+    machine.mail.outcomes = {{}, {MailEnd::NoContact, u"no route"_s}};
     MoogMeret& page = startWith(whole);
-    test.clock.time = at("10:00:00");
+    machine.clock.time = at("10:00:00");
     page.Command2_Click();
-    ASSERT_EQ(test.mail.messages.size(), 1) << "the first one at once";
-    EXPECT_EQ(test.mail.messages[0].subject, whole);
-    EXPECT_EQ(test.mail.messages[0].attachment, *test.drives.toHost(DrivePath(in(whole, u"!104_1234.jpp"_s))));
+    ASSERT_EQ(machine.mail.messages.size(), 1) << "the first one at once";
+    EXPECT_EQ(machine.mail.messages[0].subject, whole);
+    EXPECT_EQ(machine.mail.messages[0].attachment, host(DrivePath(in(whole, u"!104_1234.jpp"_s))));
     for (const char* word : {"דנה לוי", "03-1234567", "10/15", "!104_1234.jpp", "מנה 1 מתוך 3"})
-        EXPECT_TRUE(test.mail.messages[0].body.contains(QString::fromUtf8(word))) << word;
+        EXPECT_TRUE(machine.mail.messages[0].body.contains(QString::fromUtf8(word))) << word;
     EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(0, false).trimmed());
 
     for (const char* time : {"10:03:00", "10:03:00", "10:06:00", "10:06:00", "10:09:00", "10:09:00"})
         tick(time);
     EXPECT_EQ(walk(), "over");
-    ASSERT_EQ(test.mail.messages.size(), 3);
+    ASSERT_EQ(machine.mail.messages.size(), 3);
     EXPECT_EQ(page.walk().fate(1), PackageWalk::Fate::Failed);
     EXPECT_TRUE(page.controls().Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
-    EXPECT_TRUE(test.files.fileExists(DrivePath(in(whole, u"02a.jpp"_s))));
+    EXPECT_TRUE(machine.files.fileExists(DrivePath(in(whole, u"02a.jpp"_s))));
 
-    test.mail.outcomes = {{MailEnd::RecipientRefused, {}}};
+    machine.mail.outcomes = {{MailEnd::RecipientRefused, {}}};
     page.List1_Click(0);
-    EXPECT_EQ(test.mail.messages.size(), 3) << "the server has it";
+    EXPECT_EQ(machine.mail.messages.size(), 3) << "the server has it";
     page.List1_Click(1);
     EXPECT_EQ(page.controls().Label4Doar.text, MailResultText(14, false));
     page.List1_Click(1);
-    EXPECT_EQ(test.mail.messages.size(), 5);
-    EXPECT_EQ(test.mail.messages.last().attachment, *test.drives.toHost(DrivePath(in(whole, u"02a.jpp"_s))));
+    EXPECT_EQ(machine.mail.messages.size(), 5);
+    EXPECT_EQ(machine.mail.messages.last().attachment, host(DrivePath(in(whole, u"02a.jpp"_s))));
     EXPECT_EQ(page.controls().Label4Sof.text, u"כל 3 המנות נשלחו בדואר.");
 }
 
 TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
     state.profile.mail.host = u"192.0.2.25"_s;
-    test.mail.onSend = [&] {
+    machine.mail.onSend = [&] {
         MoogMeret& busy = page();
         EXPECT_TRUE(busy.answer() == MoogMeret::Answer::Sending);
         tick("10:09:00");
@@ -478,15 +461,15 @@ TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
         busy.Command5_Click();
     };
     MoogMeret& page = startWith(whole);
-    test.clock.time = at("10:00:00");
+    machine.clock.time = at("10:00:00");
     page.Command2_Click();
-    EXPECT_EQ(test.mail.messages.size(), 1);
+    EXPECT_EQ(machine.mail.messages.size(), 1);
     EXPECT_EQ(page.controls().List1.currentIndex(), 0);
     EXPECT_EQ(chain.front(), &page);
     EXPECT_EQ(page.controls().Label13.text, u"0") << "the minutes begin when the message is gone";
 
     // Stopped in the middle of a message: that one is finished, and none follows.
-    test.mail.onSend = [&] { this->page().Command19_Click(); };
+    machine.mail.onSend = [&] { this->page().Command19_Click(); };
     page.Command19_Click();
     page.Command2_Click();
     EXPECT_FALSE(page.phase() == MoogMeret::Phase::Walking || page.clockRuns());
@@ -495,21 +478,16 @@ TEST_F(FinishedOrders, NothingElseHappensWhileAMessageIsBeingSent) {
 }
 
 TEST(FinishedOrderTest, TheNameOfAFolderTellsDateAndNumber) {
-    struct Case {
-        const char* name;
-        const char* told;
-    };
-    const Case cases[] = {{"2026_11_21_KUP_1234^105", "21.11.2026 105"},
-                          {"2026_11_21_KUP_1234^105P", "21.11.2026 105 pieces"},
-                          {"2026_11_21_   _^7", "21.11.2026 7"},
-                          {"2026_13_21_KUP_1234^105", ""},
-                          {"meforakim", ""}};
-    for (const Case& c : cases) {
-        const auto order = FinishedOrderOf(QString::fromLatin1(c.name));
+    for (const auto& [name, wanted] : {std::pair("2026_11_21_KUP_1234^105", "21.11.2026 105"),
+                                       {"2026_11_21_KUP_1234^105P", "21.11.2026 105 pieces"},
+                                       {"2026_11_21_   _^7", "21.11.2026 7"},
+                                       {"2026_13_21_KUP_1234^105", ""},
+                                       {"meforakim", ""}}) {
+        const auto order = FinishedOrderOf(QString::fromLatin1(name));
         const QString told = order ? order->date.toString(u"dd.MM.yyyy"_s) + u' ' + order->number +
                                          (order->pieces ? u" pieces"_s : QString())
                                    : QString();
-        EXPECT_EQ(told.toStdString(), c.told);
+        EXPECT_EQ(told.toStdString(), wanted);
     }
 }
 

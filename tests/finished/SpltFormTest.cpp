@@ -21,13 +21,6 @@ struct SpltFormTest : ::testing::Test, PageRig {
     }
     SpltForm& page() { return static_cast<SpltForm&>(*chain.find(PageId::SpltForm)); }
     static DrivePath at(const char* leaf) { return u"C:\\order"_path / QString::fromLatin1(leaf); }
-    void write(const DrivePath& path, const QByteArray& bytes) {
-        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
-    }
-    QByteArray read(const DrivePath& path) const {
-        const auto bytes = machine.files.read(path);
-        return bytes ? *bytes : QByteArrayLiteral("can't be read");
-    }
     // The boxes since the last call.
     QStringList told() { return std::exchange(machine.dialogs.messages, {}); }
     void choose(const char* leaf, void (SpltForm::*click)()) {
@@ -83,24 +76,20 @@ TEST_F(SpltFormTest, ReadingAgainAddsAndTheSameFolderTwiceIsTold) {
     EXPECT_EQ(page().controls().List4Famely.count(), 2);
 }
 
-TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElse) {
+TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElseAndACancelledPickChangesNothing) {
     write(at("a_jpp_001_001.prk"), "abcdef");
     write(at("a.jpp"), "abcdef");
     page().Text2_Change(u"4"_s);
     choose("a.jpp", &SpltForm::Command9_Click);
     EXPECT_EQ(page().phase(), SpltForm::Phase::Partly);
     EXPECT_FALSE(machine.files.folderExists(at("meforakim")));
-    choose("a_jpp_001_001.prk", &SpltForm::Command9_Click);
-    EXPECT_EQ(read(at("meforakim\\a_jpp_001_001_prk_002_002.prk")), "ef");
-}
-
-TEST_F(SpltFormTest, ACancelledPickChangesNothing) {
-    write(at("a.jpp"), "a");
     choose("a.jpp", &SpltForm::Command2_Click);
     for (auto click : {&SpltForm::Command2_Click, &SpltForm::Command8_Click, &SpltForm::Command9_Click})
         (page().*click)();
-    EXPECT_EQ(page().controls().List4files.count(), 1);
+    EXPECT_EQ(page().controls().List4files.count(), 2);
     EXPECT_EQ(page().controls().ListChalakim.count(), 0);
+    choose("a_jpp_001_001.prk", &SpltForm::Command9_Click);
+    EXPECT_EQ(read(at("meforakim\\a_jpp_001_001_prk_002_002.prk")), "ef");
     EXPECT_EQ(machine.dialogs.messages, QStringList());
 }
 

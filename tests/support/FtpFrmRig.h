@@ -24,8 +24,7 @@ struct FtpFrmRig : SendingRig {
         profile.ReportOn = 1;
         writeLog();
         write(sheet(), QByteArray(900, 's'));
-        for (const PageId id : {PageId::hatchala, PageId::MoogMeret})
-            chain.registerPage(id, [id] { return std::make_unique<Page>(id); });
+        registerBare({PageId::hatchala, PageId::MoogMeret});
         registerPage<FtpFrm>();
         registerPage<InetForm>();
         registerPage<gdisave>();

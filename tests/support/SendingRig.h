@@ -1,24 +1,20 @@
 #pragma once
 
-#include "session/PageChain.h"
-#include "session/SessionState.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <map>
 
 namespace lumora {
 
 // A prepared order on the disk and the session that sends it, over the connection that the test brings.
-struct SendingRig {
+struct SendingRig : PageRig {
     explicit SendingRig(Internet& line)
-        : test(line) {
-        state.DiskRoot = u"C:\\"_path;
+        : PageRig(line) {
         state.transfer.OrderFolder = folder();
         ClientProfile& profile = state.profile;
         profile.ClientCode = u"tarvelmond"_s;
         profile.ReportUrl = u"http://192.0.2.10/aaaqamootreport/padd.asp"_s;
-        for (const DrivePath& path : {u"C:\\2000lumora"_path, u"C:\\2000lumora\\!!000"_path, folder()})
-            (void)test.files.makeFolder(path);
+        makeFolder(folder());
         write(first(), QByteArray("\xFF\xD8\r\n\n\r\0--OLA_GRAIN--\r\n", 23).repeated(300));
         write(second(), QByteArray("\xFF\xD8\n\n second").repeated(500));
     }
@@ -31,7 +27,7 @@ struct SendingRig {
     static QString list() { return u"filelisthom.txt"_s; }
     static DrivePath local(const QString& leaf) { return folder() / leaf; }
 
-    void write(const QString& leaf, const QByteArray& bytes) { (void)test.files.writeWhole(local(leaf), bytes); }
+    void write(const QString& leaf, const QByteArray& bytes) { (void)machine.files.writeWhole(local(leaf), bytes); }
     // What the local folder holds by leaf name, without the server's list.
     std::map<QString, QByteArray> localFiles() const {
         std::map<QString, QByteArray> bytes;
@@ -43,12 +39,10 @@ struct SendingRig {
     }
     template <class P>
     void registerPage() {
-        chain.registerPage(P::pageId, [this] { return std::make_unique<P>(state, test.platform, chain); });
+        PageRig::registerPage<P>(P::pageId);
     }
 
-    TestPlatform test;
-    SessionState state;
-    PageChain chain{test.pump};
+    TestPlatform& test = machine;
 };
 
 } // namespace lumora
