@@ -47,6 +47,13 @@ protected:
         chain.show(PageId::B3);
         return *dynamic_cast<B3*>(chain.find(PageId::B3));
     }
+    // The page of either kind of order, and its start.
+    PreparationPage& openEither(bool edits, const QStringList& items) {
+        return edits ? static_cast<PreparationPage&>(open(items)) : openWith(items);
+    }
+    static void start(PreparationPage& page) {
+        page.id() == PageId::B3 ? static_cast<B3&>(page).Command5_Click() : static_cast<Form2&>(page).Command3_Click();
+    }
     // The paths that failed.
     QStringList prepare(const QStringList& items) {
         B3& page = open(items);

@@ -15,16 +15,12 @@ protected:
         state.Optint = edits ? OrderKind::EditedPrint : OrderKind::Print;
         const HostPath aside = host(u"C:\\aside"_s);
         fs::remove_all(aside);
-        PreparationPage& page =
-            edits ? static_cast<PreparationPage&>(open(items)) : static_cast<PreparationPage&>(openWith(items));
+        PreparationPage& page = openEither(edits, items);
         machine.pump.onPump = [&] {
             if (page.controls().Label17.text == u"3"_s && !fs::exists(aside))
                 fs::copy(host(folder()), aside, fs::copy_options::recursive);
         };
-        if (edits)
-            static_cast<B3&>(page).Timer2_Tick();
-        else
-            static_cast<Form2&>(page).Command3_Click();
+        start(page);
         machine.pump.onPump = {};
         ASSERT_EQ(front(), PageId::FtpFrm);
         undisturbed = content();
@@ -45,10 +41,7 @@ protected:
         EXPECT_EQ(found.size(), 1);
         const bool edits = takeUpOrder(found.first(), state, machine.files) == Outcome::EditedTakenUp;
         chain.show(edits ? PageId::B3 : PageId::Form2);
-        if (edits)
-            dynamic_cast<B3*>(chain.front())->Timer2_Tick();
-        else
-            dynamic_cast<Form2*>(chain.front())->Command3_Click();
+        start(*dynamic_cast<PreparationPage*>(chain.front()));
         EXPECT_EQ(front(), PageId::FtpFrm);
         return found.first();
     }
