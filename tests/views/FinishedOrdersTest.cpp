@@ -8,7 +8,6 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "views/window/ScreenDialogs.h"
 
 namespace lumora {
 
@@ -41,11 +40,9 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     // Nobody listens at this port.
     Walk walk(GetParam(), u"[Switches]\nSplitPage = yes\n[Mail]\nServer = 127.0.0.1\nPort = 9\nTls = none\n"
                           "From = kiosk@example.com\nTo = lab@example.com\n"_s);
-    walk.toMenu();
-    walk.press(u"nnn"_s, u"Image1(4)"_s, u"MoogMeret"_s);
-    look(walk, u"60-no-orders"_s);
+    go(walk, toMenu + u"Image1(4)>MoogMeret :60-no-orders"_s);
     const QString pieces = makeOrders(walk);
-    pressAndLook(walk, u"MoogMeret"_s, u"Command5"_s, u"61-orders"_s);
+    go(walk, u"Command5 :61-orders"_s);
     auto& page = walk.page<MoogMeret>(PageId::MoogMeret);
     const QString whole = page.controls().List3.item(page.controls().List3.count() - 2);
     walk.choose(u"MoogMeret"_s, u"List3"_s, whole);
@@ -54,26 +51,19 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     ASSERT_TRUE(ControlFinder(walk.program().window()).drag(u"MoogMeret"_s, u"Picture1"_s, {80, 80}, {10, 10}).ok());
     EXPECT_GT(page.controls().HScroll1.value, 0);
     EXPECT_GT(page.controls().VScroll1.value, 0);
-    walk.press(u"MoogMeret"_s, u"Command21"_s);
+    go(walk, u"Command21"_s);
     walk.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(2));
     walk.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(3));
     EXPECT_EQ(page.files().markedCount(), 2);
-    look(walk, u"63-two-marked"_s);
-
-    pressAndLook(walk, u"MoogMeret"_s, u"Command2"_s, u"64-walk"_s);
+    go(walk, u":63-two-marked Command2 :64-walk"_s);
     EXPECT_FALSE(walk.pressable(u"MoogMeret"_s, u"Command18"_s));
-    pressAndLook(walk, u"MoogMeret"_s, u"Command19"_s, u"65-walk-ended"_s);
+    go(walk, u"Command19 :65-walk-ended"_s);
     EXPECT_EQ(page.walk().fate(0), PackageWalk::Fate::Failed);
-    walk.press(u"MoogMeret"_s, u"Command4Orders"_s);
     // The operator's page leads back to the orders.
-    walk.press(u"MoogMeret"_s, u"Command4Pieces"_s, u"SpltForm"_s);
-    walk.program().chain().unload(PageId::SpltForm);
-    walk.waitFor(u"MoogMeret"_s);
-
+    go(walk, u"Command4Orders Command4Pieces>SpltForm Image3>MoogMeret"_s);
     walk.choose(u"MoogMeret"_s, u"List3"_s, pieces);
     EXPECT_EQ(page.files().markedCount(), 4);
-    look(walk, u"66-in-pieces"_s);
-    walk.press(u"MoogMeret"_s, u"Command4"_s, u"FtpFrm"_s);
+    go(walk, u":66-in-pieces Command4>FtpFrm"_s);
 }
 
 // An order folder is cut, a piece is lost, and what is left is joined: by pressing what the operator sees.
@@ -87,15 +77,10 @@ TEST_P(FinishedOrdersLook, AreCutIntoPiecesAndJoinedAgain) {
 
     walk.program().chain().show(PageId::MoogMeret);
     walk.waitFor(u"MoogMeret"_s);
-    walk.press(u"MoogMeret"_s, u"Command4Pieces"_s, u"SpltForm"_s);
-    look(walk, u"70-pieces-start"_s);
+    go(walk, u"Command4Pieces>SpltForm :70-pieces-start"_s);
     lookAtPicker(walk, u"SpltForm"_s, u"Command2"_s, u"71-pieces-picker"_s);
     walk.pick(u"SpltForm"_s, u"Command2"_s, order / u"2026_11_21_KUP_1234^105.txt");
-    look(walk, u"72-pieces-to-cut"_s);
-    pressAndLook(walk, u"SpltForm"_s, u"Command3"_s, u"73-pieces-cut"_s);
-    walk.type(u"SpltForm"_s, u"Text2"_s, u"none"_s);
-    pressAndLook(walk, u"SpltForm"_s, u"Command3"_s, u"74-pieces-wrong-size"_s);
-    walk.program().dialogs().closeMessages();
+    go(walk, u":72-pieces-to-cut Command3 :73-pieces-cut Text2=none Command3 :74-pieces-wrong-size !"_s);
 
     const DrivePath pieces = order / u"meforakim";
     ASSERT_TRUE(files.removeFile(pieces / u"02 1015GNB0002_03AABB_jpp_001_002.prk").ok());
@@ -117,11 +102,9 @@ TEST_P(FinishedOrdersLook, AreCutIntoPiecesAndJoinedAgain) {
         look(walk, u"76-pieces-busy"_s);
         EXPECT_TRUE(walk.pressable(u"SpltForm"_s, u"Command15"_s));
     });
-    walk.press(u"SpltForm"_s, u"Command1"_s);
+    go(walk, u"Command1 :77-pieces-joined"_s);
     EXPECT_TRUE(seen);
-    look(walk, u"77-pieces-joined"_s);
     EXPECT_EQ(files.names(pieces / u"moorkavim", u"*"_s).size(), 5);
-    walk.press(u"SpltForm"_s, u"Image3"_s, u"MoogMeret"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, FinishedOrdersLook, PageLook::screens(), PageLook::nameOf);

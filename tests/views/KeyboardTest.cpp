@@ -57,12 +57,10 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     walk.key(Qt::Key_Tab);
     text(u"03-1234567"_s);
     walk.key(Qt::Key_Return); // the main action
-    press(walk, u"Option1(0)"_s, Qt::Key_Space);
-    press(walk, u"Option3(1)"_s);
-    press(walk, u"Image13(9)"_s, Qt::Key_Space);
-    press(walk, u"Command6"_s);
-    press(walk, u"Check1"_s, Qt::Key_Space);
-    press(walk, u"Command3"_s);
+    const QString controls[] = {u"Option1(0)"_s, u"Option3(1)"_s, u"Image13(9)"_s,
+                                u"Command6"_s,   u"Check1"_s,     u"Command3"_s};
+    for (const QString& control : controls)
+        press(walk, control, (&control - controls) % 2 == 0 ? Qt::Key_Space : Qt::Key_Return);
     walk.waitFor(u"kyoskNew"_s);
 
     // The picker runs an event loop of its own below the press.
@@ -109,7 +107,7 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
 TEST(Keyboard, StaysOnACardThatIsTaken) {
     Walk walk({1024, 768});
     walk.activate();
-    walk.toMenu();
+    walk.go(toMenu);
     press(walk, u"Image1(6)"_s);
     ASSERT_EQ(focusName(), u"Text1(0)"_s) << "the first box has the keyboard";
     text(u"Studio Or"_s);

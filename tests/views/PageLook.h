@@ -40,9 +40,8 @@ protected:
         for (const QString& fault : walk.faults())
             ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
     }
-    void pressAndLook(Walk& walk, const QString& page, const QString& control, const QString& name) {
-        walk.press(page, control);
-        look(walk, name);
+    void go(Walk& walk, const QString& route) {
+        walk.go(route, [&](const QString& name) { look(walk, name); });
     }
     // The picker waits in an event loop of its own below the press: it is looked at from within, and cancelled.
     void lookAtPicker(Walk& walk, const QString& page, const QString& button, const QString& name) {

@@ -8,7 +8,6 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "views/window/ScreenDialogs.h"
 
 #include <QTest>
 #include <QTimer>
@@ -19,51 +18,19 @@ using namespace Qt::StringLiterals;
 
 TEST_P(PageLook, FromTheStartToTheTerms) {
     Walk walk(GetParam());
-    look(walk, u"01-start"_s);
-    walk.toMenu();
-    look(walk, u"02-menu"_s);
-    if (walk.pressable(u"nnn"_s, u"Command14"_s)) {
-        pressAndLook(walk, u"nnn"_s, u"Command14"_s, u"03-clean"_s);
-        walk.press(u"nnn"_s, u"Command9"_s);
-    }
-    walk.press(u"nnn"_s, u"Command15"_s, u"Havharot"_s);
-    look(walk, u"04-notice"_s);
-    walk.press(u"Havharot"_s, u"Command1"_s, u"nnn"_s);
-    pressAndLook(walk, u"nnn"_s, u"Image1(0)"_s, u"05-details"_s);
-    pressAndLook(walk, u"nnn"_s, u"Command10"_s, u"06-message"_s);
-    walk.program().dialogs().closeMessages();
-    walk.toOptions();
-    look(walk, u"07-options"_s);
-    walk.toBorder();
-    look(walk, u"08-border"_s);
-    walk.toTerms();
-    look(walk, u"09-terms"_s);
-    pressAndLook(walk, u"nnn"_s, u"Command3"_s, u"09-terms-not-agreed"_s);
-    walk.program().dialogs().closeMessages();
+    go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
+    go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! "_s + toOptions + u":07-options "_s);
+    go(walk, toBorder + u":08-border "_s + toTerms + u":09-terms Command3 :09-terms-not-agreed !"_s);
 }
 
 TEST_P(PageLook, FromThePicturesToTheSending) {
     Walk walk(GetParam(), u"[Switches]\nCoupon = no\n"_s);
-    walk.toDetails();
-    walk.toOptions();
-    walk.toBorder();
-    walk.toTerms();
-    walk.toPictures();
-    look(walk, u"10-no-pictures"_s);
+    go(walk, toDetails + toOptions + toBorder + toTerms + toPictures + u":10-no-pictures"_s);
     lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
-    walk.choosePictures();
-    look(walk, u"12-pictures"_s);
-    walk.press(u"kyoskNew"_s, u"Picture2"_s, u"Form3"_s);
-    look(walk, u"12-upright"_s);
-    pressAndLook(walk, u"Form3"_s, u"Command1"_s, u"12-turned"_s);
-    walk.press(u"Form3"_s, u"Command3"_s, u"kyoskNew"_s);
-    pressAndLook(walk, u"kyoskNew"_s, u"Image6"_s, u"13-help"_s);
-    walk.press(u"kyoskNew"_s, u"helpClose"_s);
-    pressAndLook(walk, u"kyoskNew"_s, u"Image10"_s, u"14-leave"_s);
-    walk.press(u"kyoskNew"_s, u"Command4"_s);
-    walk.toClosing();
-    look(walk, u"15-closing"_s);
-    walk.press(u"kyoskNew"_s, u"Command7"_s, u"FtpFrm"_s);
+    walk.pick(u"kyoskNew"_s, u"Image5"_s);
+    go(walk, u"Picture1(0) Picture1(1) Picture1(4) Command12(1) :12-pictures Picture2>Form3 :12-upright Command1 "
+             ":12-turned Command3>kyoskNew Image6 :13-help helpClose Image10 :14-leave Command4 Image7 :15-closing "
+             "Command7>FtpFrm"_s);
     walk.settle(200);
     look(walk, u"17-countdown"_s);
 }
@@ -74,24 +41,15 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
         u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
         "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
         "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n"_s);
-    walk.toMenu();
-    walk.press(u"nnn"_s, u"Image1(2)"_s);
-    walk.toOptions();
+    go(walk, toMenu + u"Image1(2) "_s + toOptions);
     const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;
     walk.choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex()));
-    walk.press(u"nnn"_s, u"Option3(0)"_s);
-    walk.toTerms();
-    look(walk, u"23-fit"_s);
-    walk.press(u"nnn"_s, u"Option5"_s);
-    walk.toPictures();
+    go(walk, u"Option3(0) "_s + toTerms + u":23-fit Option5 "_s + toPictures);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
-    look(walk, u"23-whole-folder"_s);
-    walk.press(u"kyoskNew"_s, u"Command24"_s);
+    go(walk, u":23-whole-folder Command24"_s);
     walk.program().state().coupon.MisparKoopon = 14;
     walk.program().state().coupon.HaKoopon = 1;
-    pressAndLook(walk, u"kyoskNew"_s, u"Image7"_s, u"24-panel-in-front"_s);
-    pressAndLook(walk, u"kyoskNew"_s, u"Command21"_s, u"24-branches"_s);
-    pressAndLook(walk, u"kyoskNew"_s, u"Command4Snif(10)"_s, u"24-closing-coupon"_s);
+    go(walk, u"Image7 :24-panel-in-front Command21 :24-branches Command4Snif(10) :24-closing-coupon"_s);
 }
 
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
@@ -114,9 +72,8 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     walk.program().chain().show(PageId::B3);
     auto& page = walk.page<B3>(PageId::B3);
     page.Command5_Click();
-    walk.program().dialogs().closeMessages();
     ASSERT_TRUE(files.removeFile(orders).ok());
-    look(walk, u"25-to-prepare"_s);
+    go(walk, u"! :25-to-prepare"_s);
     // In the middle of the work: the timer ticks while the page lets the screen update.
     QTimer middle;
     bool looked = false;
@@ -138,50 +95,25 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
 
 TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
     Walk walk(GetParam(), u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
-    walk.toMenu();
-    walk.press(u"nnn"_s, u"Image1(6)"_s);
-    const auto lookAtRest = [&](const QString& name) {
-        const AlbumControls& album = walk.page<nnn>(PageId::nnn).album().controls();
-        EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }, 60000));
-        look(walk, name);
+    // The panels slide to their places before they are looked at.
+    const auto goOn = [&](const QString& route) {
+        walk.go(route, [&](const QString& name) {
+            const AlbumControls& album = walk.page<nnn>(PageId::nnn).album().controls();
+            EXPECT_TRUE(QTest::qWaitFor([&] { return album.panelShift + album.parentsShift == 0; }, 60000));
+            look(walk, name);
+        });
     };
-    int box = 0;
-    for (const QString& text : {u"Studio Or"_s, u"03-7654321"_s, u"Wedding"_s, u"studio"_s})
-        walk.type(u"nnn"_s, u"Text1(%1)"_s.arg(box++), text);
-    walk.choose(u"nnn"_s, u"Combo4Mail"_s, u"gmail.com"_s);
-    lookAtRest(u"40-album-photographer"_s);
-    walk.press(u"nnn"_s, u"Command17"_s);
-    lookAtRest(u"41-album-kinds"_s);
-    walk.press(u"nnn"_s, u"SoogAlb(4)"_s);
-    walk.tick(u"nnn"_s, u"Check4"_s);
-    walk.press(u"nnn"_s, u"Command27"_s);
-    walk.choose(u"nnn"_s, u"Combo4Horim"_s, u"30/60"_s);
-    lookAtRest(u"42-album-parents"_s);
-    walk.press(u"nnn"_s, u"Command16"_s);
-    walk.choose(u"nnn"_s, u"Combo4Godel"_s, u"30/60"_s);
-    lookAtRest(u"43-album-size"_s);
-    walk.press(u"nnn"_s, u"Command18"_s);
-    walk.press(u"nnn"_s, u"Combo4Cricha(1)"_s);
-    lookAtRest(u"44-album-cover"_s);
+    goOn(toMenu + u"Image1(6) Text1(0)=Studio_Or Text1(1)=03-7654321 Text1(2)=Wedding Text1(3)=studio "
+                  "Combo4Mail~gmail.com :40-album-photographer Command17 :41-album-kinds SoogAlb(4) Check4+ Command27 "
+                  "Combo4Horim~30/60 :42-album-parents Command16 Combo4Godel~30/60 :43-album-size Command18 "
+                  "Combo4Cricha(1) :44-album-cover"_s);
     walk.key(Qt::Key_Escape);
     EXPECT_EQ(walk.page<nnn>(PageId::nnn).album().panel(), AlbumPanels::Panel::Size) << "Esc goes one panel back";
-    walk.press(u"nnn"_s, u"Command18"_s);
-    walk.press(u"nnn"_s, u"Command19"_s);
-    walk.press(u"nnn"_s, u"Combo4Niyar(2)"_s);
-    lookAtRest(u"45-album-paper"_s);
-    walk.press(u"nnn"_s, u"Command20"_s);
-    walk.press(u"nnn"_s, u"Combo4Tosefet(1)"_s);
-    walk.tick(u"nnn"_s, u"Check3(2)"_s);
-    lookAtRest(u"46-album-extras"_s);
-    walk.press(u"nnn"_s, u"Command21"_s);
-    walk.tick(u"nnn"_s, u"Check6"_s);
-    lookAtRest(u"47-album-bill"_s);
-    walk.press(u"nnn"_s, u"Command22"_s, u"kyoskNew"_s);
+    goOn(u"Command18 Command19 Combo4Niyar(2) :45-album-paper Command20 Combo4Tosefet(1) Check3(2)+ :46-album-extras "
+         "Command21 Check6+ :47-album-bill Command22>kyoskNew"_s);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
     EXPECT_TRUE(walk.pressable(u"kyoskNew"_s, u"Image13"_s));
-    look(walk, u"48-album-pictures"_s);
-    walk.press(u"kyoskNew"_s, u"Command24"_s);
-    pressAndLook(walk, u"kyoskNew"_s, u"Image7"_s, u"49-album-closing"_s);
+    go(walk, u":48-album-pictures Command24 Image7 :49-album-closing"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens(), PageLook::nameOf);

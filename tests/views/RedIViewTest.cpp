@@ -55,11 +55,7 @@ protected:
         walk.settle();
     }
     void look(const QString& name) { PageLook::look(walk, name); }
-    void press(const QString& name, const QString& shot = {}) {
-        walk.press(u"RedI"_s, name);
-        if (!shot.isEmpty())
-            look(shot);
-    }
+    void go(const QString& route) { PageLook::go(walk, route); }
 
     Walk walk;
 };
@@ -86,34 +82,26 @@ TEST_P(RedEyeView, LeadsFromTheEyeToTheCorrectionWithEveryControlInReach) {
                                       {u"Image13"_s, QPoint(0, 1)},
                                       {u"Image12"_s, QPoint(0, -1)}}) {
         const QPoint at = searched();
-        press(arrow);
+        go(arrow);
         EXPECT_EQ(searched(), at + RedI::arrowStep * step) << qPrintable(arrow);
     }
     const int size = page().sight().circle().width();
-    press(u"Image11"_s);
+    go(u"Image11"_s);
     EXPECT_EQ(page().sight().circle().width(), size + 1);
-    press(u"Image10"_s);
+    go(u"Image10"_s);
     EXPECT_EQ(page().sight().circle().width(), size);
     QWheelEvent turn(canvas.rect().center(), canvas.mapToGlobal(canvas.rect().center()), {}, {0, 120}, Qt::NoButton,
                      Qt::NoModifier, Qt::NoScrollPhase, false);
     for (int i = 0; i < 8; ++i)
         QCoreApplication::sendEvent(&canvas, &turn);
     EXPECT_EQ(page().sight().circle().width(), size + 16);
-    look(u"redi-3-aim"_s);
-
-    press(u"Image2"_s);
+    go(u":redi-3-aim Image2"_s);
     EXPECT_TRUE(page().picture().RedChanged);
     EXPECT_LT(RedEye::redness(page().picture().Picture1.image().pixel(eye)), 20);
-    look(u"redi-4-corrected"_s);
-    press(u"Frame6"_s);
-    press(u"Image6"_s, u"redi-5-darkened"_s);
+    go(u":redi-4-corrected Frame6 Image6 :redi-5-darkened"_s);
     for (const QString& name : {u"Image16"_s, u"Image7"_s, u"CommandCloser"_s, u"CommandFurther"_s, u"Image5"_s})
         EXPECT_TRUE(walk.pressable(u"RedI"_s, name)) << qPrintable(name);
-    press(u"CommandMenu"_s, u"redi-6-menu"_s);
-    press(u"CommandMenuClose"_s);
-    press(u"CommandHelp"_s, u"redi-7-help"_s);
-    press(u"CommandHelpClose"_s);
-    press(u"Image7"_s);
+    go(u"CommandMenu :redi-6-menu CommandMenuClose CommandHelp :redi-7-help CommandHelpClose Image7"_s);
     EXPECT_GT(RedEye::redness(page().picture().Picture1.image().pixel(eye)), 200);
 }
 
@@ -123,7 +111,7 @@ TEST_P(RedEyeHands, OpensItsMenuByTheRightButtonALongPressAndAButton) {
     const QPoint middle = canvas.rect().center();
     QTest::mouseClick(&canvas, Qt::RightButton, {}, middle);
     walk.settle();
-    press(u"CommandMenuClose"_s);
+    go(u"CommandMenuClose"_s);
 
     const QPoint before = searched();
     QTest::mousePress(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
@@ -131,14 +119,10 @@ TEST_P(RedEyeHands, OpensItsMenuByTheRightButtonALongPressAndAButton) {
     EXPECT_TRUE(page().controls().kofez.visible);
     QTest::mouseRelease(&canvas, Qt::LeftButton, {}, middle + QPoint(40, 40));
     EXPECT_EQ(searched(), before) << "it was no pick";
-    press(u"Memokad"_s);
-
-    press(u"CommandMenu"_s);
-    press(u"amok5"_s);
+    go(u"Memokad CommandMenu amok5"_s);
     EXPECT_FALSE(page().controls().kofez.visible);
     EXPECT_TRUE(page().picture().RedChanged);
-    press(u"CommandMenu"_s);
-    press(u"Rstor"_s);
+    go(u"CommandMenu Rstor"_s);
     EXPECT_FALSE(page().picture().RedChanged);
 }
 
@@ -161,16 +145,14 @@ TEST_P(RedEyeHands, FollowsADragTheKeysAndAHeldArrow) {
     EXPECT_FALSE(walk.pressable(u"RedI"_s, u"HScroll1"_s)) << "not for customers";
     walk.program().state().DegelEdit = true;
     pressOverview(eye);
-    for (const QString& button : {u"Command13"_s, u"Command6"_s, u"Image2"_s})
-        press(button);
+    go(u"Command13 Command6 Image2"_s);
     EXPECT_GT(page().picture().RedPeakValue, 200);
     walk.control(u"HScroll1"_s).setFocus();
     walk.key(Qt::Key_Home);
     walk.key(Qt::Key_PageUp);
     EXPECT_GT(page().picture().RedFixLevel, 0);
     EXPECT_EQ(page().picture().RedFixLevel, 10 * page().controls().HScroll1);
-    look(u"redi-8-operator"_s);
-    press(u"Image9"_s);
+    go(u":redi-8-operator Image9"_s);
     EXPECT_FALSE(walk.program().chain().find(PageId::RedI));
 }
 

@@ -81,12 +81,9 @@ protected:
 TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
     auto& page = open<FtpFrm>();
     until(page, SendingPhase::Countdown);
-    look(walk, u"17-countdown"_s);
-    walk.press(u"FtpFrm"_s, u"Command23"_s);
+    go(walk, u":17-countdown Command23"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Waiting);
-    look(walk, u"17-waiting"_s);
-    pressAndLook(walk, u"FtpFrm"_s, u"Image3"_s, u"20-leave-sending"_s);
-    walk.press(u"FtpFrm"_s, u"Command14"_s);
+    go(walk, u":17-waiting Image3 :20-leave-sending Command14"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Countdown);
 
     lab.putFaults = {{first, FakeLab::always, -1}};
@@ -99,20 +96,15 @@ TEST_P(SendingLook, ByFtpFromTheCountThroughAFailureToTheEnd) {
     walk.press(u"FtpFrm"_s, u"Image5"_s);
     EXPECT_EQ(page.phase(), SendingPhase::NotAll);
     EXPECT_TRUE(waits.empty());
-    look(walk, u"19-failed"_s);
-    pressAndLook(walk, u"FtpFrm"_s, u"Command24"_s, u"22-for-the-lab"_s);
-    walk.press(u"FtpFrm"_s, u"cmdClosehOpen"_s);
-    pressAndLook(walk, u"FtpFrm"_s, u"cmdInternetOpen"_s, u"22-by-hand"_s);
+    go(walk, u":19-failed Command24 :22-for-the-lab cmdClosehOpen cmdInternetOpen :22-by-hand"_s);
     EXPECT_TRUE(walk.pressable(u"FtpFrm"_s, u"Command3"_s));
-    walk.press(u"FtpFrm"_s, u"Command9"_s);
+    go(walk, u"Command9"_s);
 
     lab.putFaults.clear();
     lookWhen(u"21-reporting"_s, [&] { return page.phase() == SendingPhase::Reporting; });
     walk.press(u"FtpFrm"_s, u"Command10"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Success);
-    look(walk, u"21-sent"_s);
-    walk.press(u"FtpFrm"_s, u"Command28"_s);
-    EXPECT_EQ(walk.program().chain().front()->id(), PageId::hatchala);
+    go(walk, u":21-sent Command28>hatchala"_s);
 }
 
 TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
@@ -140,18 +132,7 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
     lab.onPut = [&](const QString&) { stopped.Command15_Click(); };
     startNow(stopped);
     EXPECT_EQ(stopped.phase(), SendingPhase::Stopped);
-    walk.program().dialogs().closeMessages();
-    look(walk, u"24-stopped"_s);
-}
-
-TEST_P(SendingLook, ByFtpInPieces) {
-    walk.program().state().transfer.Mefurak = Travel::Pieces;
-    for (const char* name : {"a_001_003.prk", "a_002_003.prk", "a_003_003.prk"})
-        write(QString::fromLatin1(name), "piece");
-    auto& page = open<FtpFrm>();
-    lookWhen(u"25-sending-pieces"_s, [&] { return page.controls().Label4Diff.visible; });
-    startNow(page);
-    EXPECT_TRUE(waits.empty());
+    go(walk, u"! :24-stopped"_s);
 }
 
 TEST_P(SendingLook, WithoutAnOrderAndWithoutAServer) {
@@ -161,8 +142,7 @@ TEST_P(SendingLook, WithoutAnOrderAndWithoutAServer) {
     look(walk, u"68-http-no-server"_s);
     state.profile.FtpServer.clear();
     until(open<FtpFrm>(), SendingPhase::NoServer);
-    walk.program().dialogs().closeMessages();
-    look(walk, u"23-no-server"_s);
+    go(walk, u"! :23-no-server"_s);
     state.profile.FtpServer = u"192.0.2.10"_s;
     state.transfer.OrderFolder = {};
     until(open<FtpFrm>(), SendingPhase::NoOrder);
@@ -176,11 +156,9 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     auto& page = open<UploadForm>();
     lookWhen(u"60-http-checking"_s, [&] { return page.controls().Pic4Hamten.visible; });
     until(page, SendingPhase::Countdown);
-    look(walk, u"61-http-countdown"_s);
-    walk.press(u"UploadForm"_s, u"Command3"_s);
+    go(walk, u":61-http-countdown Command3"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Waiting);
-    look(walk, u"62-http-stopped"_s);
-    walk.press(u"UploadForm"_s, u"Command10"_s);
+    go(walk, u":62-http-stopped Command10"_s);
     lookWhen(u"63-http-sending"_s, [&] { return page.controls().percent >= 50; });
     lookWhen(u"64-http-sending-again"_s,
              [&] { return page.controls().percent == 25 && !page.controls().Label1.text.isEmpty(); });
@@ -189,9 +167,7 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     for (int tick = 0; tick < 7; ++tick)
         page.Timer2_Tick();
     EXPECT_EQ(page.phase(), SendingPhase::NotAll);
-    look(walk, u"65-http-failed"_s);
-    pressAndLook(walk, u"UploadForm"_s, u"Command24"_s, u"65-http-for-the-lab"_s);
-    walk.press(u"UploadForm"_s, u"Command9"_s);
+    go(walk, u":65-http-failed Command24 :65-http-for-the-lab Command9"_s);
 
     lab.deadCalls = lab.deadPosts = 0;
     lookWhen(u"66-http-verifying"_s, [&] { return page.phase() == SendingPhase::Checking; });
@@ -200,9 +176,7 @@ TEST_P(SendingLook, ByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     EXPECT_TRUE(waits.empty());
     look(walk, u"67-http-sent"_s);
     until(open<UploadForm>(), SendingPhase::AllThere);
-    look(walk, u"70-http-all-there"_s);
-    walk.press(u"UploadForm"_s, u"Command28"_s);
-    EXPECT_EQ(walk.program().chain().front()->id(), PageId::hatchala);
+    go(walk, u":70-http-all-there Command28>hatchala"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, SendingLook, PageLook::screens(), PageLook::nameOf);

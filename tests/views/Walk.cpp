@@ -27,6 +27,7 @@
 #include <QListWidget>
 #include <QPainter>
 #include <QPushButton>
+#include <QRegularExpression>
 #include <QScrollArea>
 #include <QTest>
 
@@ -188,10 +189,6 @@ void Walk::choose(const QString& page, const QString& control, const QString& ro
     expectDone(finder().choose(page, control, row));
 }
 
-void Walk::tick(const QString& page, const QString& control) {
-    expectDone(finder().tick(page, control, true));
-}
-
 void Walk::activate() {
     m_program->window().activateWindow();
     ASSERT_TRUE(QTest::qWaitForWindowActive(&m_program->window()));
@@ -234,45 +231,23 @@ void Walk::waitFor(const QString& page) {
     settle();
 }
 
-void Walk::toMenu() {
-    press(u"hatchala"_s, u"Image1"_s, u"nnn"_s);
-}
-
-void Walk::toDetails() {
-    toMenu();
-    press(u"nnn"_s, u"Image1(0)"_s);
-}
-
-void Walk::toOptions() {
-    type(u"nnn"_s, u"Text2"_s, u"Dana Levi"_s);
-    type(u"nnn"_s, u"Text3"_s, u"03-1234567"_s);
-    press(u"nnn"_s, u"Command12"_s);
-}
-
-void Walk::toBorder() {
-    press(u"nnn"_s, u"Option1(0)"_s);
-    press(u"nnn"_s, u"Option3(1)"_s);
-}
-
-void Walk::toTerms() {
-    press(u"nnn"_s, u"Image13(0)"_s);
-    press(u"nnn"_s, u"Command6"_s);
-}
-
-void Walk::toPictures() {
-    press(u"nnn"_s, u"Check1"_s);
-    press(u"nnn"_s, u"Command3"_s, u"kyoskNew"_s);
-}
-
-void Walk::choosePictures() {
-    pick(u"kyoskNew"_s, u"Image5"_s);
-    for (const int cell : {0, 1, 4})
-        press(u"kyoskNew"_s, u"Picture1(%1)"_s.arg(cell));
-    press(u"kyoskNew"_s, u"Command12(1)"_s);
-}
-
-void Walk::toClosing() {
-    press(u"kyoskNew"_s, u"Image7"_s);
+void Walk::go(const QString& route, const std::function<void(const QString&)>& look) {
+    for (const QString& step : route.split(u' ', Qt::SkipEmptyParts)) {
+        const QString page = finder().frontPage();
+        const QString control = step.section(QRegularExpression(u"[>=~+]"_s), 0, 0);
+        if (step == u"!"_s)
+            m_program->dialogs().closeMessages();
+        else if (step.startsWith(u':'))
+            look(step.mid(1));
+        else if (step.contains(u'='))
+            type(page, control, step.section(u'=', 1).replace(u'_', u' '));
+        else if (step.contains(u'~'))
+            choose(page, control, step.section(u'~', 1));
+        else if (step.endsWith(u'+'))
+            expectDone(finder().tick(page, control, true));
+        else
+            press(page, control, step.section(u'>', 1));
+    }
 }
 
 void Walk::writeFrames() {
@@ -295,13 +270,9 @@ void Walk::writeFrames() {
 
 void Walk::toEditor() {
     writeFrames();
-    toMenu();
-    press(u"nnn"_s, u"Image1(1)"_s);
-    toOptions();
-    toBorder();
-    toPictures();
+    go(toMenu + u"Image1(1) "_s + toOptions + toBorder + toPictures);
     pick(u"kyoskNew"_s, u"Image5"_s);
-    press(u"kyoskNew"_s, u"Picture1(0)"_s, u"tFrmNew"_s);
+    go(u"Picture1(0)>tFrmNew"_s);
 }
 
 void Walk::write(const DrivePath& path, const QByteArray& bytes) {

@@ -14,6 +14,8 @@
 
 namespace lumora {
 
+using namespace Qt::StringLiterals;
+
 class Internet;
 
 // The name of the widget that has the keyboard.
@@ -23,6 +25,14 @@ struct Screen {
     QSize size;
     bool english;
 };
+
+// Parts of a route, from the start page on.
+inline const QString toMenu = u"Image1>nnn "_s;
+inline const QString toDetails = toMenu + u"Image1(0) "_s;
+inline const QString toOptions = u"Text2=Dana_Levi Text3=03-1234567 Command12 "_s;
+inline const QString toBorder = u"Option1(0) Option3(1) "_s;
+inline const QString toTerms = u"Image13(0) Command6 "_s;
+inline const QString toPictures = u"Check1 Command3>kyoskNew "_s;
 
 // The whole program on a fresh drive with a folder of pictures, used as a customer uses it: by pressing controls that
 // are visible, enabled and not covered. A step that fails is a failure of the test that takes it.
@@ -44,7 +54,6 @@ public:
     void press(const QString& page, const QString& control, const QString& comes = {});
     void type(const QString& page, const QString& control, const QString& text);
     void choose(const QString& page, const QString& control, const QString& row);
-    void tick(const QString& page, const QString& control);
     bool pressable(const QString& page, const QString& control);
     // Lets the program work until the page is in front, for some seconds at most.
     void waitFor(const QString& page);
@@ -57,15 +66,11 @@ public:
     // The lab's picker gives the first picture, or this one, to what the button opens.
     void pick(const QString& page, const QString& button, const DrivePath& path = {});
 
-    // From the start page to the page and step named.
-    void toMenu();
-    void toDetails();
-    void toOptions();
-    void toBorder();
-    void toTerms();
-    void toPictures();
-    void choosePictures();
-    void toClosing();
+    // Goes a route of steps with a blank between them: "Command3" is pressed on the page in front, "Command3>kyoskNew"
+    // and that page waited for, "Text2=Dana_Levi" typed with a blank for the _, "Combo1~30/60" chosen, "Check4+"
+    // ticked,
+    // "!" closes the boxes, ":menu" looks.
+    void go(const QString& route, const std::function<void(const QString& name)>& look = {});
     // A quick order with the first picture open in the editor. The lab has frames in two categories.
     void toEditor();
 
