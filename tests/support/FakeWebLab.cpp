@@ -110,7 +110,8 @@ Result<void> FakeWebLab::download(const QString& url, const HostPath& target) {
     if (refusesLists || !m_listed.contains(folder))
         return Failure{Failure::Kind::Refused, u"404"_s};
     const QByteArray list = listOf(folder);
-    std::ofstream(target, std::ios::binary).write(list.constData(), list.size());
+    if (!std::ofstream(target, std::ios::binary).write(list.constData(), list.size()))
+        return Failure{Failure::Kind::Other, toText(target)};
     return {};
 }
 

@@ -1,5 +1,8 @@
 #include "support/MailServer.h"
 
+#include <Poco/Net/StreamSocket.h>
+#include <Poco/Timespan.h>
+
 #include <QElapsedTimer>
 #include <QFile>
 #include <QThread>
@@ -22,67 +25,32 @@ QByteArray outputOf(QStringList command) {
     return process.waitForFinished(60'000) ? process.readAllStandardOutput() : QByteArray();
 }
 
-// Unencrypted the server offers challenge and response besides the password; encrypted it takes the password alone, by
-// another command on each port. So a test can use each way of logging in.
-const char* const configuration = R"(primary_hostname = mail.lab.example
-spool_directory = %1/spool
-log_file_path = %1/log/%slog
-pid_file_path = %1/spool/pid
-local_interfaces = 127.0.0.1
-daemon_smtp_ports = %2 : %3
-tls_on_connect_ports = %3
-tls_certificate = %1/authority.pem
-tls_privatekey = %1/key.pem
-tls_advertise_hosts = %4
-message_size_limit = %5
-check_spool_space = %6
-check_spool_inodes = 0
-deliver_drop_privilege = true
-host_lookup =
-rfc1413_query_timeout = 0s
-keep_environment =
-acl_smtp_rcpt = recipient
-begin acl
-recipient:
-  deny !authenticated = *
-       message = log in first
-  require verify = recipient
-  accept
-begin routers
-box:
-  driver = accept
-  domains = lab.example
-  local_parts = orders
-  transport = box
-begin transports
-box:
-  driver = appendfile
-  file = %1/box/orders
-begin authenticators
-proof:
-  driver = cram_md5
-  public_name = CRAM-MD5
-  server_advertise_condition = ${if eq{$tls_in_cipher}{}}
-  server_secret = ${if eq{$auth1}{%7}{%8}fail}
-  server_set_id = $auth1
-plain:
-  driver = plaintext
-  public_name = PLAIN
-  server_advertise_condition = ${if eq{$received_port}{%2}}
-  server_condition = ${if and{{eq{$auth2}{%7}}{eq{$auth3}{%8}}}}
-  server_set_id = $auth2
-login:
-  driver = plaintext
-  public_name = LOGIN
-  server_prompts = Username:: : Password::
-  server_advertise_condition = ${if eq{$received_port}{%3}}
-  server_condition = ${if and{{eq{$auth1}{%7}}{eq{$auth2}{%8}}}}
-  server_set_id = $auth1
-)";
+bool answers(quint16 port) {
+    try {
+        Poco::Net::StreamSocket socket;
+        socket.connect(Poco::Net::SocketAddress("127.0.0.1", port), Poco::Timespan(1, 0));
+        return true;
+    } catch (const std::exception&) {
+        return false;
+    }
+}
+
+// Waits until the server answers on its port; false when it ended, as on a port that another took meanwhile, or never
+// answered.
+bool comesUp(QProcess& server, quint16 port) {
+    QElapsedTimer waiting;
+    waiting.start();
+    while (server.state() != QProcess::NotRunning && waiting.elapsed() < 60'000) {
+        if (answers(port))
+            return true;
+        server.waitForFinished(20);
+    }
+    return false;
+}
 
 } // namespace
 
-MailServer::MailServer(Disk disk, Encryption encryption) {
+MailServer::MailServer() {
     // The server's own user works in here.
     const auto open = static_cast<QFile::Permissions>(0x7777);
     QFile::setPermissions(m_folder.path(), static_cast<QFile::Permissions>(0x7711));
@@ -92,26 +60,40 @@ MailServer::MailServer(Disk disk, Encryption encryption) {
         QFile::setPermissions(path, open);
     }
     if (makeCertificate())
-        start({&m_port, &m_tlsPort}, [&] {
-            return asRoot({u"/usr/sbin/exim4"_s, u"-C"_s, configure(disk, encryption), u"-bdf"_s});
-        });
+        start();
+}
+
+void MailServer::start() {
+    m_server.setProcessChannelMode(QProcess::MergedChannels);
+    for (int attempt = 0; attempt < 3; ++attempt) {
+        m_port = FreePort();
+        m_tlsPort = FreePort();
+        QStringList words = asRoot({u"/usr/sbin/exim4"_s, u"-C"_s, configure(), u"-bdf"_s});
+        const QString program = words.takeFirst();
+        m_server.start(program, words);
+        if (comesUp(m_server, m_port) && comesUp(m_server, m_tlsPort))
+            return;
+    }
+    m_failure = u"exim did not start: %1"_s.arg(QString::fromUtf8(m_server.readAll()));
 }
 
 MailServer::~MailServer() {
     m_server.terminate();
+    if (!m_server.waitForFinished(5'000))
+        m_server.kill();
     m_server.waitForFinished(5'000);
     // QTemporaryDir does not remove the files of the server's user.
     outputOf(asRoot({u"rm"_s, u"-rf"_s, m_folder.path()}));
 }
 
-QString MailServer::configure(Disk disk, Encryption encryption) const {
+QString MailServer::configure() const {
     const QString path = m_folder.filePath(u"exim.conf"_s);
     const MailAccount known = account();
-    QString text = QLatin1String(configuration);
-    const QString values[] = {m_folder.path(), QString::number(m_port), QString::number(m_tlsPort),
-                              encryption == Encryption::Offered ? u"*"_s : QString(), QString::number(largestMessage),
-                              // The full server asks for more free space than any disk has.
-                              disk == Disk::Full ? u"1000000G"_s : u"0"_s, known.user, known.password};
+    QFile form(QStringLiteral(LUMORA_EXIM_CONF));
+    QString text = form.open(QIODevice::ReadOnly) ? QString::fromUtf8(form.readAll()) : QString();
+    const QString values[] = {
+        m_folder.path(), QString::number(m_port), QString::number(m_tlsPort), QString::number(largestMessage),
+        known.user,      known.password};
     int number = 0;
     for (const QString& value : values)
         text.replace(u'%' + QString::number(++number), value);

@@ -1,11 +1,14 @@
 #pragma once
 
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/StreamSocket.h>
+
 #include <QByteArray>
-#include <QByteArrayList>
 #include <QString>
 
 #include <atomic>
 #include <chrono>
+#include <functional>
 #include <list>
 #include <mutex>
 #include <thread>
@@ -41,35 +44,30 @@ public:
     TcpRelay(const TcpRelay&) = delete;
     TcpRelay& operator=(const TcpRelay&) = delete;
 
-    quint16 port() const { return m_port; }
-    QString host() const { return u"127.0.0.1:%1"_s.arg(m_port); }
+    quint16 port() const { return m_listener.address().port(); }
+    QString host() const { return u"127.0.0.1:%1"_s.arg(port()); }
 
     // Applies from now on.
     void setFaults(const Faults& faults);
     int faultsMade() const { return m_made; }
-    // The command lines that clients sent, without their line ends.
-    QByteArrayList commands() const;
 
 private:
     void acceptLoop();
-    void control(int client);
-    void data(int listener, quint16 serverPort);
-    void pumpBytes(int client, int server);
+    void control(Poco::Net::StreamSocket client);
+    void pumpBytes(Poco::Net::StreamSocket client, quint16 serverPort);
     // Counts a fault if one more is due.
     bool due();
     Faults faults() const;
     QByteArray ownPort(const QByteArray& reply);
-    void spawn(std::thread thread);
+    void spawn(const std::function<void()>& work);
 
     Kind m_kind;
     quint16 m_serverPort;
-    quint16 m_port = 0;
-    int m_listener = -1;
+    Poco::Net::ServerSocket m_listener{Poco::Net::SocketAddress("127.0.0.1", 0)};
     std::atomic<bool> m_stop = false;
     std::atomic<int> m_made = 0;
     mutable std::mutex m_mutex;
     Faults m_faults;
-    QByteArrayList m_commands;
     std::list<std::thread> m_threads;
     std::thread m_acceptor;
 };

@@ -526,6 +526,16 @@ TEST_F(UploadFormTest, AnOldListPassesForNothingAndIsNotSent) {
     EXPECT_FALSE(rig.test.files.fileExists(UploadFormRig::folder() / UploadFormRig::list()));
 }
 
+TEST_F(UploadFormTest, AListThatCanNotBeKeptIsATroubleOfThisComputer) {
+    rig.makeFolder(UploadFormRig::folder() / UploadFormRig::list()); // where the list should be stored
+    UploadForm& page = rig.send();
+    EXPECT_EQ(page.look().sign, SendingSign::Bad);
+    EXPECT_EQ(page.controls().Label4Reason.text, LineTroubleText(rig.state, LineStep::KeepList, {}));
+    std::filesystem::remove(rig.host(UploadFormRig::folder() / UploadFormRig::list()));
+    page.Image5_Click();
+    EXPECT_TRUE(hasArrived(page.phase()));
+}
+
 TEST_F(UploadFormTest, NothingMoreIsSentOnceThePageIsLeft) {
     lab.onPost = [&](const QString&) { rig.page().Image3_Click(); };
     rig.send();

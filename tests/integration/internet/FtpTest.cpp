@@ -51,11 +51,10 @@ HostPath write(const QTemporaryDir& folder, const char* name, const QByteArray& 
 // --- What every connection must keep, that of the fake lab too ---
 
 struct Lab {
-    enum class Server { Fake, Lab, Second, Given };
+    enum class Server { Fake, Lab, Given };
     const char* name;
     Server server = Server::Lab;
     FtpType type = FtpType::Image;
-    bool keepsNames = true; // in the ANSI code page
 };
 
 void PrintTo(const Lab& lab, std::ostream* out) {
@@ -75,13 +74,6 @@ protected:
             ASSERT_TRUE(labServers->running()) << labServers->failure().toStdString();
             login = {labServers->ftpHost(), LabServers::user(), LabServers::password()};
             account = labServers->account();
-            break;
-        case Lab::Server::Second:
-            second.emplace();
-            ASSERT_TRUE(second->running()) << second->failure().toStdString();
-            login = {second->ftpHost(), SecondFtpServer::user(), SecondFtpServer::password()};
-            account = second->account();
-            std::filesystem::create_directory(account / "zalamim234");
             break;
         case Lab::Server::Given:
             // Host, user, password and folder of a running server; tests/matrix/run gives each of its own.
@@ -112,7 +104,6 @@ protected:
     FakeLab fake;
     PocoInternet internet{TimeLimits(), GetParam().type};
     std::optional<LabServers> labServers;
-    std::optional<SecondFtpServer> second;
     QStringList login;
     HostPath account;
 };
@@ -201,14 +192,12 @@ TEST_P(FtpContract, KeepsNamesOfTheCodePageAndRefusesAWrongPasswordAndANameWithA
         EXPECT_FALSE(ftp.list(name));
     }
     EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s)).empty());
-    if (GetParam().keepsNames) {
-        ASSERT_TRUE(ftp.makeDirectory(u"הזמנה 7"_s));
-        ASSERT_TRUE(ftp.setCurrentDirectory(u"הזמנה 7"_s));
-        EXPECT_EQ(ftp.currentDirectory().value(), u"/zalamim234/הזמנה 7"_s);
-        ASSERT_TRUE(ftp.put(write(local, "x", "x"), u"שלום.txt"_s));
-        EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s)).contains(u"שלום.txt"_s));
-        EXPECT_TRUE(isFake() || stored(u"zalamim234"_s, "\xe4\xe6\xee\xf0\xe4 7/\xf9\xec\xe5\xed.txt") == "x");
-    }
+    ASSERT_TRUE(ftp.makeDirectory(u"הזמנה 7"_s));
+    ASSERT_TRUE(ftp.setCurrentDirectory(u"הזמנה 7"_s));
+    EXPECT_EQ(ftp.currentDirectory().value(), u"/zalamim234/הזמנה 7"_s);
+    ASSERT_TRUE(ftp.put(write(local, "x", "x"), u"שלום.txt"_s));
+    EXPECT_TRUE(filesOf(*ftp.list(u"*.*"_s)).contains(u"שלום.txt"_s));
+    EXPECT_TRUE(isFake() || stored(u"zalamim234"_s, "\xe4\xe6\xee\xf0\xe4 7/\xf9\xec\xe5\xed.txt") == "x");
     fake.refusedLogins = 1;
     const auto refused = connect(DataChannel::Passive, u"wr0ng-pass"_s);
     ASSERT_FALSE(refused);
@@ -232,7 +221,6 @@ TEST_P(FtpContract, AnAbortEndsTheConnectionsThatStandAndNoOther) {
 INSTANTIATE_TEST_SUITE_P(Labs, FtpContract,
                          ::testing::Values(Lab{.name = "fake", .server = Lab::Server::Fake},
                                            Lab{.name = "vsftpd_A", .type = FtpType::Ascii}, Lab{.name = "vsftpd_I"},
-                                           Lab{.name = "pyftpdlib", .server = Lab::Server::Second, .keepsNames = false},
                                            Lab{.name = "given", .server = Lab::Server::Given}),
                          [](const ::testing::TestParamInfo<Lab>& each) { return each.param.name; });
 
