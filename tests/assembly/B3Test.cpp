@@ -6,6 +6,8 @@
 
 #include <QPainter>
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
@@ -177,34 +179,29 @@ TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
 }
 
 TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
-    struct Case {
-        Sender sender;
-        bool local;
-        QStringList sheets;
-        PageId front;
-        int messages;
-    };
     const QString jpp = u"!105_1234.jpp"_s, jpg = u"!105_1234.jpg"_s;
     const QString picture = edited(givePicture(u"one_1.jpg"_s));
-    for (const Case& c :
-         {Case{Sender::Ftp, false, {jpp}, PageId::FtpFrm, 0}, Case{Sender::Ftp, true, {jpg, jpp}, PageId::hatchala, 0},
-          Case{Sender::Http, true, {jpg}, PageId::hatchala, 0},
-          Case{Sender::Http, false, {jpg}, PageId::hatchala, 1}, // no page to go on with
-          Case{Sender::Http, false, {jpg}, PageId::UploadForm, 0}}) {
-        SCOPED_TRACE(static_cast<int>(c.front));
+    for (const auto& [sender, local, sheets, next, messages] :
+         std::initializer_list<std::tuple<Sender, bool, QStringList, PageId, int>>{
+             {Sender::Ftp, false, {jpp}, PageId::FtpFrm, 0},
+             {Sender::Ftp, true, {jpg, jpp}, PageId::hatchala, 0},
+             {Sender::Http, true, {jpg}, PageId::hatchala, 0},
+             {Sender::Http, false, {jpg}, PageId::hatchala, 1}, // no page to go on with
+             {Sender::Http, false, {jpg}, PageId::UploadForm, 0}}) {
+        SCOPED_TRACE(static_cast<int>(next));
         state.MisparHazmana = u"105"_s;
-        state.transfer.SugSheliach = c.sender;
-        state.TachanaMekomit = c.local;
+        state.transfer.SugSheliach = sender;
+        state.TachanaMekomit = local;
         state.handOver.notice.clear();
         machine.dialogs.messages.clear();
-        if (c.front == PageId::UploadForm)
+        if (next == PageId::UploadForm)
             registerBare({PageId::UploadForm});
         prepare({picture});
-        EXPECT_EQ(machine.files.names(folder(), u"!*"_s), c.sheets);
+        EXPECT_EQ(machine.files.names(folder(), u"!*"_s), sheets);
         EXPECT_EQ(checkOrderFolder(host(folder()), {56, 30})->faults, QStringList());
-        EXPECT_EQ(front(), c.front);
-        EXPECT_EQ(state.handOver.notice.contains(u"105"_s), c.front == PageId::hatchala);
-        EXPECT_EQ(machine.dialogs.messages.size(), c.messages);
+        EXPECT_EQ(front(), next);
+        EXPECT_EQ(state.handOver.notice.contains(u"105"_s), next == PageId::hatchala);
+        EXPECT_EQ(machine.dialogs.messages.size(), messages);
         chain.unload(front());
         std::filesystem::remove_all(host(folder()));
     }

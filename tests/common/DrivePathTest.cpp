@@ -2,18 +2,15 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 namespace lumora {
 namespace {
 
 using namespace Qt::StringLiterals;
 
 TEST(DrivePath, TakesPathsApart) {
-    const struct {
-        const char* path;
-        const char* leaf;
-        const char* stem;
-        const char* folder;
-    } cases[] = {
+    const std::array<const char*, 4> cases[] = {
         {"C:\\pics\\a.jpg", "a.jpg", "a", "C:\\pics"},
         {"C:\\pics\\", "", "", "C:\\pics"},
         {"C:\\", "", "", "C:"},
@@ -22,11 +19,11 @@ TEST(DrivePath, TakesPathsApart) {
         {"", "***", "", "***"},
         {"\\a", "a", "", "***"},
     };
-    for (const auto& each : cases) {
-        const DrivePath path(QString::fromLatin1(each.path));
-        EXPECT_EQ(path.leaf().toStdString(), each.leaf) << each.path;
-        EXPECT_EQ(path.stem().toStdString(), each.stem) << each.path;
-        EXPECT_EQ(path.folder().text().toStdString(), each.folder) << each.path;
+    for (const auto& [text, leaf, stem, folder] : cases) {
+        const DrivePath path(QString::fromLatin1(text));
+        EXPECT_EQ(path.leaf().toStdString(), leaf) << text;
+        EXPECT_EQ(path.stem().toStdString(), stem) << text;
+        EXPECT_EQ(path.folder().text().toStdString(), folder) << text;
     }
 }
 

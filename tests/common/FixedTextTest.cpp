@@ -4,6 +4,7 @@
 
 #include <cmath>
 #include <limits>
+#include <utility>
 
 namespace lumora {
 namespace {
@@ -17,15 +18,13 @@ TEST(LeftField, FillsWithBlanksAndCutsByCharacters) {
 }
 
 TEST(Val, ReadsTheLeadingNumberOnly) {
-    const struct {
-        const char* text;
-        double number;
-    } cases[] = {{"", 0},        {"abc", 0},      {"12abc", 12},  {"  7x", 7}, {"1 2 3", 123}, {"-0.5", -0.5},
-                 {".5.5", 0.5},  {"+3", 3},       {"- 4", -4},    {"--4", 0},  {"1e3x", 1000}, {"1d2", 100},
-                 {"1e", 1},      {"1e-", 1},      {"e5", 0},      {"1,5", 1},  {"007", 7},     {"-", 0},
-                 {"2E-8", 2e-8}, {"1.5e+2", 150}, {"12\n3", 123}, {"א5", 0},   {"0x10", 0}};
-    for (const auto& each : cases)
-        EXPECT_DOUBLE_EQ(Val(QString::fromUtf8(each.text)), each.number) << each.text;
+    const std::pair<const char*, double> cases[] = {
+        {"", 0},        {"abc", 0},      {"12abc", 12},  {"  7x", 7}, {"1 2 3", 123}, {"-0.5", -0.5},
+        {".5.5", 0.5},  {"+3", 3},       {"- 4", -4},    {"--4", 0},  {"1e3x", 1000}, {"1d2", 100},
+        {"1e", 1},      {"1e-", 1},      {"e5", 0},      {"1,5", 1},  {"007", 7},     {"-", 0},
+        {"2E-8", 2e-8}, {"1.5e+2", 150}, {"12\n3", 123}, {"א5", 0},   {"0x10", 0}};
+    for (const auto& [text, number] : cases)
+        EXPECT_DOUBLE_EQ(Val(QString::fromUtf8(text)), number) << text;
     EXPECT_EQ(Val(u"1e999"_s), std::numeric_limits<double>::max());
     EXPECT_EQ(Val(u"-1e999"_s), std::numeric_limits<double>::lowest());
 }
@@ -41,29 +40,23 @@ TEST(Val16, RoundsTiesToEvenAndNeverWraps) {
 
 // Colour gains as the steps of a slider leave them in single precision.
 TEST(PlainNumber, HasSevenDigitsAndNoExponent) {
-    const struct {
-        float number;
-        const char* text;
-    } cases[] = {{1.05999994F, "1.06"},
-                 {1.53999949F, "1.539999"},
-                 {0.0999999642F, "0.09999996"},
-                 {-0.0200000349F, "-0.02000003"},
-                 {-2.24411494e-07F, "-0.0000002244115"},
-                 {0, "0"},
-                 {-0.0F, "0"},
-                 {100, "100"},
-                 {16777216.0F, "16777216"},
-                 {0.99999999F, "1"},
-                 {std::numeric_limits<float>::infinity(), "0"}};
-    for (const auto& each : cases)
-        EXPECT_EQ(PlainNumber(each.number).toStdString(), each.text);
+    const std::pair<float, const char*> cases[] = {{1.05999994F, "1.06"},
+                                                   {1.53999949F, "1.539999"},
+                                                   {0.0999999642F, "0.09999996"},
+                                                   {-0.0200000349F, "-0.02000003"},
+                                                   {-2.24411494e-07F, "-0.0000002244115"},
+                                                   {0, "0"},
+                                                   {-0.0F, "0"},
+                                                   {100, "100"},
+                                                   {16777216.0F, "16777216"},
+                                                   {0.99999999F, "1"},
+                                                   {std::numeric_limits<float>::infinity(), "0"}};
+    for (const auto& [number, text] : cases)
+        EXPECT_EQ(PlainNumber(number).toStdString(), text);
 }
 
 TEST(HexToDecimal, ReadsSignedNumbersAndAnswers00ForTheRest) {
-    const struct {
-        const char* hex;
-        const char* decimal;
-    } cases[] = {
+    const std::pair<const char*, const char*> cases[] = {
         {"ff", "255"},      {" &hFF ", "255"},  {"7FFF", "32767"},
         {"8000", "-32768"}, {"FFFF", "-1"},     {"0FFFF", "65535"},
         {"10000", "65536"}, {"FFFFFFFF", "-1"}, {"80000000", "-2147483648"},
@@ -71,8 +64,8 @@ TEST(HexToDecimal, ReadsSignedNumbersAndAnswers00ForTheRest) {
         {"G1", "00"},       {"0x1F", "00"},     {"-1", "00"},
         {"+1", "00"},       {"1 2", "00"},
     };
-    for (const auto& each : cases)
-        EXPECT_EQ(HexToDecimal(QString::fromLatin1(each.hex)).toStdString(), each.decimal) << each.hex;
+    for (const auto& [hex, decimal] : cases)
+        EXPECT_EQ(HexToDecimal(QString::fromLatin1(hex)).toStdString(), decimal) << hex;
 }
 
 TEST(TextToHex, CarriesANameThereAndBack) {

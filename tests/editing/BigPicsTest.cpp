@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
@@ -27,35 +29,26 @@ TEST(SampleColorLevels, SortsItsValuesAsTextsSoThatTheBrightestComeLast) {
     EXPECT_EQ(samples.lists()[0], QStringList({u"05"_s, u"050"_s, u"200"_s}));
     EXPECT_EQ(samples.lists()[2], QStringList({u"010"_s, u"09"_s, u"099"_s}));
 
-    struct Case {
-        int value;
-        float top, gain, floor; // of a flat picture
-    };
-    for (const Case& c : {Case{0, 0.2F, 1275, 10}, Case{255, 255.2F, 0.99922F, 265}, Case{50, 50.2F, 5.07968F, 60}}) {
-        const SampleColorLevels flat(Bitmap(60, 40, QColor(c.value, 50, 5)), {5, 5, 50, 30});
-        EXPECT_EQ(flat.topLevels(), (ChannelValues{c.top, 50.2F, 5.2F}));
-        EXPECT_NEAR(flat.gains()[0], c.gain, c.gain * 1e-5);
-        EXPECT_EQ(flat.floors(10), (ChannelValues{c.floor, 60, 15}));
+    for (const auto& [value, top, gain, floor] : std::initializer_list<std::tuple<int, float, float, float>>{
+             {0, 0.2F, 1275, 10}, {255, 255.2F, 0.99922F, 265}, {50, 50.2F, 5.07968F, 60}}) {
+        const SampleColorLevels flat(Bitmap(60, 40, QColor(value, 50, 5)), {5, 5, 50, 30});
+        EXPECT_EQ(flat.topLevels(), (ChannelValues{top, 50.2F, 5.2F}));
+        EXPECT_NEAR(flat.gains()[0], gain, gain * 1e-5);
+        EXPECT_EQ(flat.floors(10), (ChannelValues{floor, 60, 15}));
     }
 }
 
 class WorkSurfaces : public ::testing::Test, protected PageRig {
 protected:
-    WorkSurfaces() { registerPage<Form3>(PageId::Form3); }
-    QString picture(const char* name, const Bitmap& bitmap) {
-        const QString path = u"C:\\"_s + QString::fromLatin1(name);
-        EXPECT_TRUE(bitmap.image().save(toText(host(path)), "BMP"));
-        return path;
-    }
-    EditedPreview opened(const QString& path) {
-        return *EditedPreview::open(host(path), {10, 15}, 100, EditedPreview::Tone::Colour);
-    }
+    WorkSurfaces() { EXPECT_TRUE(picture.image().save(toText(host(path)), "BMP")); }
 
-    BigPics surfaces;
+    const DrivePath path = u"C:\\wide.bmp"_path;
+    const Bitmap picture = halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140));
 };
 
 TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
-    surfaces.open(opened(picture("wide.bmp", halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140)))));
+    BigPics surfaces;
+    surfaces.open(*EditedPreview::open(host(path), {10, 15}, 100, EditedPreview::Tone::Colour));
     const QImage before = surfaces.workPicture()->workPicture().image().copy();
     surfaces.Command2_Click();
     EXPECT_EQ(surfaces.controls().Picture2.image().size(), QSize(400, 200));
@@ -68,32 +61,27 @@ TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
 }
 
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
+    registerPage<Form3>(PageId::Form3);
     auto& look = chain.load<Form3>();
-    const QString path = picture("look.bmp", halves(1000, 500, Qt::red, Qt::blue));
-    look.open(DrivePath(path));
-    // Red lies left, on top, right, below: a quarter turn clockwise each time, and upright again after four.
-    struct Case {
-        int angle;
-        PictureSize box;
-        double redX, redY;
-    };
-    for (const Case& c :
-         {Case{0, {700, 350}, 0.1, 0.5}, Case{90, {350, 700}, 0.5, 0.1}, Case{180, {700, 350}, 0.9, 0.5},
-          Case{270, {350, 700}, 0.5, 0.9}, Case{0, {700, 350}, 0.1, 0.5}}) {
-        EXPECT_EQ(look.controls().angle, c.angle);
-        EXPECT_EQ(look.controls().Picture2Box, c.box);
-        const QImage& shown = look.controls().Picture2.image();
-        EXPECT_EQ(shown.width() * c.box.height, shown.height() * c.box.width);
-        EXPECT_EQ(shown.pixelColor(static_cast<int>(shown.width() * c.redX), static_cast<int>(shown.height() * c.redY)),
-                  QColor(Qt::red))
-            << c.angle;
+    look.open(path);
+    const auto& shown = look.controls();
+    // The dark half lies left, on top, right, below: a quarter turn clockwise each time, and upright again after four.
+    for (const auto& [angle, x, y] :
+         {std::tuple(0, 0.1, 0.5), {90, 0.5, 0.1}, {180, 0.9, 0.5}, {270, 0.5, 0.9}, {0, 0.1, 0.5}}) {
+        EXPECT_EQ(shown.angle, angle);
+        EXPECT_EQ(shown.Picture2Box, angle % 180 == 0 ? (PictureSize{700, 350}) : (PictureSize{350, 700}));
+        const QImage& image = shown.Picture2.image();
+        EXPECT_EQ(image.width() * shown.Picture2Box.height, image.height() * shown.Picture2Box.width);
+        EXPECT_EQ(image.pixelColor(static_cast<int>(image.width() * x), static_cast<int>(image.height() * y)),
+                  QColor(20, 40, 60))
+            << angle;
         look.Command1_Click();
     }
     std::filesystem::remove(host(path));
     look.Command2_Click();
-    EXPECT_TRUE(look.controls().Picture2.isNull());
+    EXPECT_TRUE(shown.Picture2.isNull());
     ASSERT_EQ(machine.dialogs.messages.size(), 1);
-    EXPECT_TRUE(machine.dialogs.messages.first().contains(u"look.bmp"_s));
+    EXPECT_TRUE(machine.dialogs.messages.first().contains(u"wide.bmp"_s));
     look.Command3_Click();
     EXPECT_EQ(chain.find(PageId::Form3), nullptr);
 }

@@ -1,6 +1,4 @@
 #include "editing/render/EditedPicture.h"
-#include "imaging/drawing/CaptionDraw.h"
-#include "imaging/drawing/Drawing.h"
 #include "imaging/scaling/Resample.h"
 #include "order/EditRecord.h"
 #include "session/SessionState.h"
@@ -12,8 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <cstdlib>
-#include <functional>
+#include <tuple>
 
 namespace lumora {
 namespace {
@@ -83,12 +80,7 @@ double differenceOf(const Bitmap& seen, const Bitmap& larger) {
 }
 
 TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
-    struct Case {
-        const char* file;
-        PaperSize paper;
-        const char* record;
-    };
-    const Case cases[] = {
+    const std::tuple<const char*, PaperSize, const char*> cases[] = {
         {"lying.png", {10, 15}, "1   1   1   195150245 140 0  0  000"},
         {"lying.png", {10, 15}, "1   1   1   16760 200 170 0  0  000"},
         {"lying.png", {10, 15}, "1.3 1   0.8 360210300 90  1  0  000"},
@@ -106,16 +98,16 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
          "1   1   1   180100150 225 0  0  000000000000          242 0 0 1 ddd       30 255255280200"
          "0  3 0 DejaVu Sans                   Lumora 2024"},
     };
-    for (const Case& given : cases) {
-        const EditFields edit = fieldsOf(QString::fromLatin1(given.record));
-        const Bitmap seen = preview(given.file, edit, given.paper);
-        const Bitmap full = print(given.file, edit, given.paper);
-        ASSERT_FALSE(seen.isNull() || full.isNull()) << given.record;
-        EXPECT_LE(differenceOf(seen, full), 3.0) << given.record;
+    for (const auto& [file, paper, record] : cases) {
+        const EditFields edit = fieldsOf(QString::fromLatin1(record));
+        const Bitmap seen = preview(file, edit, paper);
+        const Bitmap full = print(file, edit, paper);
+        ASSERT_FALSE(seen.isNull() || full.isNull()) << record;
+        EXPECT_LE(differenceOf(seen, full), 3.0) << record;
         EditFields bare = edit;
         bare.TextOn = 0;
-        EXPECT_TRUE(edit.TextOn == 0 || print(given.file, bare, given.paper).image() != full.image()) << given.record;
-        EXPECT_TRUE(edit.TextOn == 0 || preview(given.file, bare, given.paper).image() != seen.image()) << given.record;
+        EXPECT_TRUE(edit.TextOn == 0 || print(file, bare, paper).image() != full.image()) << record;
+        EXPECT_TRUE(edit.TextOn == 0 || preview(file, bare, paper).image() != seen.image()) << record;
     }
     // What the measure is worth: a print that is moved, turned or toned a little differently is told from the preview.
     const auto differs = [&](const char* record) {
@@ -173,109 +165,6 @@ TEST_F(EditedPictureTest, aPictureNeverOpenedPrintsStretchedAndOneThatCanNotBeRe
     request.file = path("frames");
     request.paper = {10, 15};
     EXPECT_FALSE(renderEditedPrintToJpeg(request, EditFields()));
-}
-
-// The box of the pixels that are not white.
-QRect darkBox(const Bitmap& paper) {
-    QRect ink;
-    for (int y = 0; y < paper.height(); ++y) {
-        for (int x = 0; x < paper.width(); ++x) {
-            if (qGreen(paper.image().pixel(x, y)) < 200)
-                ink |= QRect(x, y, 1, 1);
-        }
-    }
-    return ink;
-}
-
-QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double scale = 1) {
-    PictureCaption caption;
-    caption.text = u"HHHH\r\nH"_s;
-    caption.family = u"DejaVu Sans"_s;
-    caption.emSize = 24;
-    caption.align = align;
-    caption.run = run;
-    caption.x = 200;
-    caption.y = 150;
-    Bitmap paper(static_cast<int>(400 * scale), static_cast<int>(300 * scale), Qt::white);
-    drawInk(paper, inkOf(caption, {paper.width(), paper.height()}, {scale, scale}));
-    return darkBox(paper);
-}
-
-TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
-    using Align = PictureCaption::Align;
-    using Run = PictureCaption::Run;
-    // Four letters of 0.752 em and a third of an em; the base line of the first line is 22 below the anchor, the pitch
-    // 28. The letter's own bearing is a tenth of an em.
-    const double length = 24 * (4 * 0.752 + 1 / 3.0);
-    struct Case {
-        Align align;
-        double start;
-    };
-    for (const Case& expected : {Case{Align::Near, 0}, Case{Align::Centre, -length / 2}, Case{Align::Far, -length}}) {
-        const QRect across = inkOfCaption(expected.align, Run::Across);
-        EXPECT_NEAR(across.left(), 200 + expected.start + 24 / 6.0 + 2.4 - 2, 1.6);
-        EXPECT_NEAR(across.top(), 150 + 22 - 17.5 - 2, 1.6);
-        EXPECT_NEAR(across.bottom(), 150 + 22 + 28, 1.6);
-        EXPECT_NEAR(across.width(), 4 * 0.752 * 24 - 4.8 + 2, 2.6) << "the second line lies within the first";
-        const QRect down = inkOfCaption(expected.align, Run::Down);
-        EXPECT_NEAR(down.top(), 150 + expected.start + 24 / 6.0 + 2.4 - 2, 1.6);
-        EXPECT_NEAR(down.right(), 200 - (22 - 17.5), 1.6);
-        EXPECT_LT(down.right(), 200);
-    }
-    const QRect small = inkOfCaption(Align::Centre, Run::Across);
-    const QRect large = inkOfCaption(Align::Centre, Run::Across, 10 / 3.0);
-    EXPECT_NEAR(large.left(), small.left() * 10 / 3.0, 4);
-    EXPECT_NEAR(large.width(), small.width() * 10 / 3.0, 6);
-}
-
-TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavidOnPicturesAndSheet) {
-    for (const auto& [family, drawn] : {std::pair(u"No Such Family"_s, false), std::pair(u"David"_s, true)}) {
-        PictureCaption caption;
-        caption.text = u"שלום Lumora\r\n2024"_s;
-        caption.family = family;
-        Bitmap paper(200, 80, Qt::white);
-        drawInk(paper, inkOf(caption, {200, 80}));
-        EXPECT_EQ(!darkBox(paper).isNull(), drawn) << qPrintable(family);
-        Bitmap sheet(200, 80, Qt::white);
-        drawText(sheet, {5, 5}, caption.text, {.family = family, .pixelSize = 24});
-        EXPECT_EQ(darkBox(sheet).height() > 30, drawn) << "two lines";
-    }
-}
-
-TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
-    CaptionInks inks;
-    PictureCaption caption;
-    caption.text = u"שלום Lumora\r\n2024"_s;
-    caption.family = u"DejaVu Sans"_s;
-    caption.emSize = 24;
-    PaperScale scale;
-    const std::function<void()> steps[] = {
-        [&] { caption.x = 40; },
-        [&] { caption.y = 190; },
-        [&] { caption.emSize = 31; },
-        [&] { caption.align = PictureCaption::Align::Centre; },
-        [&] {
-            scale = {1.5, 1.5};
-        },
-        [&] { caption.run = PictureCaption::Run::Down; },
-        [&] { caption.colour = Qt::red; },
-        [&] { caption.emSize = 99; }, // larger than the paper: no longer kept
-        [&] { caption.text = u"A"_s; },
-        [&] { caption.family = u"No Such Family"_s; },
-        [&] { caption.family = u"DejaVu Sans"_s; },
-    };
-    for (std::size_t i = 0; i < std::size(steps); ++i) {
-        steps[i]();
-        Bitmap kept(300, 200, Qt::white);
-        Bitmap fresh = kept;
-        drawInk(kept, inks.inkOf(caption, {300, 200}, scale));
-        drawInk(fresh, inkOf(caption, {300, 200}, scale));
-        // Outlines fall on 64ths of a pixel, which may round otherwise at another place.
-        for (int at = 0; at < 300 * 200; ++at) {
-            const auto green = [at](const Bitmap& paper) { return qGreen(paper.image().pixel(at % 300, at / 300)); };
-            ASSERT_NEAR(green(kept), green(fresh), 8) << "step " << i;
-        }
-    }
 }
 
 } // namespace

@@ -1,28 +1,25 @@
 // The editor with the lab's guards off and on.
 #include "TheEditor.h"
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
 TEST_F(TheEditor, carefullyPacksATurnAndAPlaceThatComeBackAsTheyWereSeen) {
-    struct Case {
-        const char* turnZoomPan;
-        Button button;
-        EditRecord::Column column;
-        const char *builtIn, *careful; // after ten ticks
-    };
-    for (const Case& c : {Case{"-90100225 150 ", turnLeft, EditRecord::RotationCode, "-10", "260"},
-                          Case{"-89100225 150 ", turnLeft, EditRecord::RotationCode, "-99", "-99"},
-                          Case{"180100665 150 ", right, EditRecord::PanX, "685 ", "674 "},
-                          Case{"180100-215150 ", left, EditRecord::PanX, "-235", "-224"},
-                          Case{"180210770 150 ", right, EditRecord::PanX, "790 ", "780 "},
-                          Case{"180100225 460 ", down, EditRecord::PanY, "480 ", "467 "}}) {
+    for (const auto& [turnZoomPan, button, column, builtIn, guarded] : // after ten ticks
+         {std::tuple("-90100225 150 ", turnLeft, EditRecord::RotationCode, "-10", "260"),
+          {"-89100225 150 ", turnLeft, EditRecord::RotationCode, "-99", "-99"},
+          {"180100665 150 ", right, EditRecord::PanX, "685 ", "674 "},
+          {"180100-215150 ", left, EditRecord::PanX, "-235", "-224"},
+          {"180210770 150 ", right, EditRecord::PanX, "790 ", "780 "},
+          {"180100225 460 ", down, EditRecord::PanY, "480 ", "467 "}}) {
         for (const bool careful : {false, true}) {
-            SCOPED_TRACE(c.careful);
+            SCOPED_TRACE(careful);
             state.Careful = careful;
-            open(lying, EditRecord::newPicture().replace(12, 14, QString::fromLatin1(c.turnZoomPan)));
-            hold(c.button, 10);
-            EXPECT_EQ(field(c.column), QLatin1String(careful ? c.careful : c.builtIn));
+            open(lying, EditRecord::newPicture().replace(12, 14, QString::fromLatin1(turnZoomPan)));
+            hold(button, 10);
+            EXPECT_EQ(field(column), QLatin1String(careful ? guarded : builtIn));
             const QImage seen = paper();
             open(lying, QString(state.edit.EditState));
             EXPECT_TRUE(!careful || paper() == seen) << "what was seen is what opens again";
@@ -74,24 +71,23 @@ TEST_F(TheEditor, carefullyRaisesTheZoomOfATurnedPictureToWhatCovers) {
         : key == u'C' ? holdImage2(0, 40)
                       : holdImage2(1, 30);
     };
-    struct Case {
-        const char *what, *keys; // quarter, back, upright, undo, slanted, closer, much closer, further
-        int panX;
-        const char *builtIn, *careful;
-    };
-    for (const Case& c :
-         {Case{"a quarter", "q", 225, "100", "134"}, Case{"back", "qb", 225, "100", "100"},
-          Case{"upright", "su", 225, "100", "100"}, Case{"slanted", "s", 225, "100", "158"},
-          Case{"its own zoom", "qcb", 225, "102", "136"}, Case{"bare on purpose", "qfq", 225, "40 ", "74 "},
-          Case{"bare before", "fq", 225, "40 ", "40 "}, Case{"undone, and anew", "qzb", 225, "100", "134"},
-          Case{"no further", "Cs", 90, "180", "210"}}) {
+    // The keys: quarter, back, upright, undo, slanted, closer, much closer, further.
+    for (const auto& [what, keys, panX, builtIn, guarded] : {std::tuple("a quarter", "q", 225, "100", "134"),
+                                                             {"back", "qb", 225, "100", "100"},
+                                                             {"upright", "su", 225, "100", "100"},
+                                                             {"slanted", "s", 225, "100", "158"},
+                                                             {"its own zoom", "qcb", 225, "102", "136"},
+                                                             {"bare on purpose", "qfq", 225, "40 ", "74 "},
+                                                             {"bare before", "fq", 225, "40 ", "40 "},
+                                                             {"undone, and anew", "qzb", 225, "100", "134"},
+                                                             {"no further", "Cs", 90, "180", "210"}}) {
         for (const bool careful : {false, true}) {
-            SCOPED_TRACE(c.what);
+            SCOPED_TRACE(what);
             state.Careful = careful;
-            open(lying, recordWith(EditRecord::PanX, QString::number(c.panX)).replace(22, 4, u"150 "_s));
-            for (const QChar key : QString::fromLatin1(c.keys))
+            open(lying, recordWith(EditRecord::PanX, QString::number(panX)).replace(22, 4, u"150 "_s));
+            for (const QChar key : QString::fromLatin1(keys))
                 press(key);
-            EXPECT_EQ(field(EditRecord::ZoomPercent), QLatin1String(careful ? c.careful : c.builtIn));
+            EXPECT_EQ(field(EditRecord::ZoomPercent), QLatin1String(careful ? guarded : builtIn));
             EXPECT_EQ(shown().Label11.text, field(EditRecord::ZoomPercent).trimmed());
         }
     }

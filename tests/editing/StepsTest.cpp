@@ -8,6 +8,8 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
@@ -78,21 +80,16 @@ TEST(KeyLayout, LiesAsOnARealKeyboardInBothLanguages) {
 }
 
 TEST(PicturePlacement, SizesThePreviewByThePaperCode) {
-    struct Case {
-        const char* code;
-        PictureSize landscape;
-        PictureSize portrait;
-    };
-    const Case cases[] = {{"1015", {450, 300}, {300, 450}},
-                          {"1318", {450, 325}, {300, 415}},
-                          {"0913", {450, 311}, {300, 433}},
-                          {"3040", {450, 337}, {300, 400}},
-                          {"1521", {450, 321}, {300, 420}}};
-    for (const Case& expected : cases) {
-        const auto paper = PaperSize::ofDigits(QString::fromLatin1(expected.code));
-        ASSERT_TRUE(paper) << expected.code;
-        EXPECT_EQ(previewBox(*paper, PaperOrientation::Landscape), expected.landscape) << expected.code;
-        EXPECT_EQ(previewBox(*paper, PaperOrientation::Portrait), expected.portrait) << expected.code;
+    const std::tuple<const char*, PictureSize, PictureSize> cases[] = {{"1015", {450, 300}, {300, 450}},
+                                                                       {"1318", {450, 325}, {300, 415}},
+                                                                       {"0913", {450, 311}, {300, 433}},
+                                                                       {"3040", {450, 337}, {300, 400}},
+                                                                       {"1521", {450, 321}, {300, 420}}};
+    for (const auto& [code, landscape, portrait] : cases) {
+        const auto paper = PaperSize::ofDigits(QString::fromLatin1(code));
+        ASSERT_TRUE(paper) << code;
+        EXPECT_EQ(previewBox(*paper, PaperOrientation::Landscape), landscape) << code;
+        EXPECT_EQ(previewBox(*paper, PaperOrientation::Portrait), portrait) << code;
     }
 }
 

@@ -1,5 +1,7 @@
 #include "TheEditor.h"
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
@@ -153,18 +155,13 @@ TEST_F(CaptionKeys, carefullyKeepsTheCaptionWithinItsColumnsAndTakesALineBreakBa
         for (const QChar character : u"a\rb\b\b"_s)
             page().KeyPress(character);
         EXPECT_EQ(state.edit.TextBody, careful ? u"a"_s : u"a\r"_s);
-        struct Case {
-            int direction;
-            std::int16_t from;
-            int builtIn, careful;
-        };
-        for (const Case& c :
-             {Case{0, -98, -10, -99}, Case{1, 998, 100, 999}, Case{2, -98, -10, -99}, Case{3, 998, 100, 999}}) {
-            state.edit.TextX = state.edit.TextY = c.from;
-            page().Image15_MouseDown(c.direction);
+        for (const auto& [direction, from, builtIn, guarded] :
+             {std::tuple(0, -98, -10, -99), {1, 998, 100, 999}, {2, -98, -10, -99}, {3, 998, 100, 999}}) {
+            state.edit.TextX = state.edit.TextY = static_cast<std::int16_t>(from);
+            page().Image15_MouseDown(direction);
             page().Timer1_Tick();
             page().Image15_MouseUp();
-            EXPECT_EQ(c.direction < 2 ? kept().TextX : kept().TextY, careful ? c.careful : c.builtIn);
+            EXPECT_EQ(direction < 2 ? kept().TextX : kept().TextY, careful ? guarded : builtIn);
         }
         stored.clear();
         state.edit.TextFontSize = 94;

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <random>
+#include <tuple>
 
 namespace lumora {
 namespace {
@@ -183,12 +184,8 @@ TEST_F(Mod4splitTest, AFullDiskLeavesWholePiecesAndTheOldJoinedFile) {
 }
 
 TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {
-    const struct {
-        const char* fault;
-        QStringList found; // leaves without "C:\p\"
-        int verdict;
-        int members;
-    } cases[] = {
+    // What was found, the verdict, and how many members.
+    const std::tuple<const char*, QStringList, int, qsizetype> cases[] = {
         {"complete", {"a_jpp_001_002.prk", "a_jpp_002_002.prk"}, 1, 2},
         {"one missing", {"a_jpp_001_003.prk", "a_jpp_003_003.prk"}, -1, 2},
         {"an exact multiple", {"a_jpp_001_002.prk"}, -1, 1},
@@ -201,10 +198,10 @@ TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {
         {"a total that is no number", {"a_jpp_001_xyz.prk"}, 11, 1},
         {"a name that is too short", {"a.prk"}, 11, 1},
     };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(c.fault);
+    for (const auto& [what, leaves, verdict, members] : cases) {
+        SCOPED_TRACE(what);
         TextList found;
-        for (const QString& leaf : c.found)
+        for (const QString& leaf : leaves)
             found.append(u"C:\\pieces\\"_s + leaf);
         found.append(u"C:\\pieces\\0 no piece.jpp"_s);
         TextList families;
@@ -215,8 +212,8 @@ TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {
         families.setCurrentIndex(0);
         TextList family;
         family.append(u"from before"_s);
-        EXPECT_EQ(CollectFamily(families, found, family), c.verdict);
-        EXPECT_EQ(family.count(), c.members);
+        EXPECT_EQ(CollectFamily(families, found, family), verdict);
+        EXPECT_EQ(family.count(), members);
     }
 }
 

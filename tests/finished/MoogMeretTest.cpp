@@ -16,8 +16,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 QDateTime at(const char* time) {
@@ -98,29 +96,22 @@ TEST_F(FinishedOrders, AreListedAndThePickedOneShowsItsFilesMarkedByItsKind) {
     EXPECT_FALSE(page.controls().Picture2.visible);
     EXPECT_EQ(page.controls().Label23.text, QString());
 
-    struct Case {
-        QString order;
-        const char* marked;
-        int files;
-        int pictures;
-        int Mefurak;
-    };
-    const Case cases[] = {
+    const std::tuple<QString, const char*, int, int, int> cases[] = {
         {whole, "!104_1234.jpp 02a.jpp 11b.JPG", 3, 13, 0},
         {pieces, "!105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk", 6, 4, 1},
         {whole, "!104_1234.jpp", 4, 0, 1}, // neither the flag nor the pattern goes back, and texts are listed too
     };
-    for (const Case& c : cases) {
-        page.List3_Click(page.controls().List3.find(c.order));
+    for (const auto& [order, names, count, pictures, travel] : cases) {
+        page.List3_Click(page.controls().List3.find(order));
         EXPECT_TRUE(page.controls().Picture2.visible);
-        EXPECT_EQ(state.transfer.OrderFolder.text(), orders + u'\\' + c.order);
-        EXPECT_EQ(marked(page), c.marked);
-        EXPECT_EQ(page.controls().Label1.text, QString::number(c.files));
-        EXPECT_EQ(page.controls().Label5.text, QString::number(c.pictures));
-        EXPECT_EQ(state.shemot.TotalPics, c.pictures);
-        EXPECT_EQ(state.transfer.Mefurak, static_cast<Travel>(c.Mefurak));
-        EXPECT_EQ(page.controls().Label4Pieces.visible, c.Mefurak > 0);
-        EXPECT_EQ(page.controls().Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), c.order == pieces);
+        EXPECT_EQ(state.transfer.OrderFolder.text(), orders + u'\\' + order);
+        EXPECT_EQ(marked(page), names);
+        EXPECT_EQ(page.controls().Label1.text, QString::number(count));
+        EXPECT_EQ(page.controls().Label5.text, QString::number(pictures));
+        EXPECT_EQ(state.shemot.TotalPics, pictures);
+        EXPECT_EQ(state.transfer.Mefurak, static_cast<Travel>(travel));
+        EXPECT_EQ(page.controls().Label4Pieces.visible, travel > 0);
+        EXPECT_EQ(page.controls().Label4Pieces.text.startsWith(u"ההזמנה נשלחת בחלקים"), order == pieces);
     }
     EXPECT_EQ(page.controls().Label4Lakoach.text, u"לקוח: דנה לוי 03-1234567");
     page.File1_Click(0);
@@ -155,32 +146,26 @@ TEST_F(FinishedOrders, ThatAreNoneOrHoldNothingAreToldAndSendNothing) {
 }
 
 TEST_F(FinishedOrders, GoOutAgainAsAListThatBeginsWithTheText) {
-    struct Case {
-        QString order;
-        const char* touched; // its mark turns over, after all is chosen or after nothing is
-        bool all;
-        QString sent;
-        const char* mailed;
-    };
     const QString text = whole + u".txt "_s;
-    const Case cases[] = {
+    // The mark of a file turns over, after all is chosen or after nothing is.
+    const std::tuple<QString, const char*, bool, QString, const char*> cases[] = {
         {whole, "", true, text + u"!104_1234.jpp 02a.jpp 11b.JPG"_s, "!104_1234.jpp 02a.jpp 11b.JPG"},
         {whole, "02a.jpp", false, text + u"02a.jpp !104_1234.jpp"_s, "!104_1234.jpp 02a.jpp"},
         {whole, "", false, text + u"!104_1234.jpp"_s, "!104_1234.jpp"},
         {pieces, "kashloo.txt", true, pieces + u".txt !105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"_s,
          "!105_1234.jpp 02a_jpp_001_002.prk 02a_jpp_002_002.prk"},
     };
-    for (const Case& c : cases) {
-        MoogMeret& page = startWith(c.order);
-        if (!c.all)
+    for (const auto& [order, touched, all, sent, mailed] : cases) {
+        MoogMeret& page = startWith(order);
+        if (!all)
             page.Command21_Click();
-        page.File1_Click(page.controls().File1.find(QString::fromLatin1(c.touched)));
-        EXPECT_EQ(leaves(page.files().mailList()).toStdString(), c.mailed);
+        page.File1_Click(page.controls().File1.find(QString::fromLatin1(touched)));
+        EXPECT_EQ(leaves(page.files().mailList()).toStdString(), mailed);
         state.transfer.SugMishloah = Sending::NewOrder;
         page.Command4_Click();
         ASSERT_EQ(chain.front()->id(), PageId::FtpFrm);
-        EXPECT_EQ(leaves(state.handOver.lines).toStdString(), c.sent.toStdString());
-        EXPECT_EQ(state.handOver.lines.value(0), in(c.order, c.order + u".txt"_s));
+        EXPECT_EQ(leaves(state.handOver.lines).toStdString(), sent.toStdString());
+        EXPECT_EQ(state.handOver.lines.value(0), in(order, order + u".txt"_s));
         EXPECT_EQ(state.transfer.SugMishloah, Sending::Resend);
         EXPECT_EQ(chain.find(PageId::MoogMeret), nullptr);
         chain.unload(PageId::FtpFrm);

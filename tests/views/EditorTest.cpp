@@ -13,8 +13,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 class EditorLook : public PageLook {};

@@ -11,8 +11,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 // Finished orders of a busy week, the last two of one day and the very last in pieces.

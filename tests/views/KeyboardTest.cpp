@@ -18,8 +18,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 void text(const QString& words) {

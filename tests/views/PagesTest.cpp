@@ -14,8 +14,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 TEST_P(PageLook, FromTheStartToTheTerms) {
     Walk walk(GetParam());
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);

@@ -16,8 +16,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 // The caption's keyboard is the page that covers the lower half of another.
 TEST(Panel, LeavesThePageBelowInSightAndUsableWhereItIsNotCovered) {
     Walk walk({1024, 768});

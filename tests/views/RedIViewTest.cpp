@@ -16,8 +16,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 constexpr PictureSize photograph{2400, 1800};

@@ -12,8 +12,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 const QString orderName = u"2026_11_21_KUP_1234^105"_s;

@@ -37,8 +37,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 // No order of a test may leave the machine: nobody listens at this port.

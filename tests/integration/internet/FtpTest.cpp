@@ -20,8 +20,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 namespace fs = std::filesystem;
 using DataChannel = Internet::DataChannel;
 

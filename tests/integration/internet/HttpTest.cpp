@@ -19,8 +19,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 // Answers each connection with the next of its texts and ends it.
 class ScriptedWeb {
 public:

@@ -16,7 +16,6 @@ using namespace Qt::StringLiterals;
 // sees them from the left, forced to stand so, and against the line mirrored and unturned.
 
 const QString family = u"DejaVu Sans"_s;
-constexpr int size = 40;
 
 QString reversed(QString text) {
     std::reverse(text.begin(), text.end());
@@ -73,11 +72,11 @@ void drawCaption(Bitmap& paper, const PictureCaption& caption) {
     drawInk(paper, inkOf(caption, {paper.width(), paper.height()}));
 }
 
-PictureCaption captionAt(int x, const QString& text) {
+PictureCaption captionAt(int x, const QString& text, int emSize = 40) {
     PictureCaption caption;
     caption.text = text;
     caption.family = family;
-    caption.emSize = size;
+    caption.emSize = emSize;
     caption.x = x;
     caption.y = 20;
     return caption;
@@ -94,7 +93,7 @@ TEST(CaptionOrder, HebrewWithDigitsAndLatinStandsAsItIsReadOnPicturesAndSheet) {
         paper = turned(turnedPaper, QuarterTurn::Left);
     });
     expectOrder("sheet", [](Bitmap& paper, const QString& text) {
-        drawText(paper, {10, 20}, text, {family, size, Qt::black, false});
+        drawText(paper, {10, 20}, text, {family, 40, Qt::black, false});
     });
 }
 
@@ -119,6 +118,98 @@ TEST(CaptionOrder, ALineIsOneLineHoweverLongAndBreaksOnlyWhereEnterWasPressed) {
         return paper.image();
     };
     EXPECT_EQ(far(u"abc\r\n"_s), far(u"abc"_s));
+}
+
+// The box of the pixels that are not white.
+QRect darkBox(const Bitmap& paper) {
+    QRect ink;
+    for (int y = 0; y < paper.height(); ++y) {
+        for (int x = 0; x < paper.width(); ++x) {
+            if (qGreen(paper.image().pixel(x, y)) < 200)
+                ink |= QRect(x, y, 1, 1);
+        }
+    }
+    return ink;
+}
+
+QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double scale = 1) {
+    PictureCaption caption = captionAt(200, u"HHHH\r\nH"_s, 24);
+    caption.align = align;
+    caption.run = run;
+    caption.y = 150;
+    Bitmap paper(static_cast<int>(400 * scale), static_cast<int>(300 * scale), Qt::white);
+    drawInk(paper, inkOf(caption, {paper.width(), paper.height()}, {scale, scale}));
+    return darkBox(paper);
+}
+
+TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
+    using Align = PictureCaption::Align;
+    using Run = PictureCaption::Run;
+    // Four letters of 0.752 em and a third of an em; the base line of the first line is 22 below the anchor, the pitch
+    // 28. The letter's own bearing is a tenth of an em.
+    const double length = 24 * (4 * 0.752 + 1 / 3.0);
+    for (const auto& [align, start] :
+         {std::pair(Align::Near, 0.0), {Align::Centre, -length / 2}, {Align::Far, -length}}) {
+        const QRect across = inkOfCaption(align, Run::Across);
+        EXPECT_NEAR(across.left(), 200 + start + 24 / 6.0 + 2.4 - 2, 1.6);
+        EXPECT_NEAR(across.top(), 150 + 22 - 17.5 - 2, 1.6);
+        EXPECT_NEAR(across.bottom(), 150 + 22 + 28, 1.6);
+        EXPECT_NEAR(across.width(), 4 * 0.752 * 24 - 4.8 + 2, 2.6) << "the second line lies within the first";
+        const QRect down = inkOfCaption(align, Run::Down);
+        EXPECT_NEAR(down.top(), 150 + start + 24 / 6.0 + 2.4 - 2, 1.6);
+        EXPECT_NEAR(down.right(), 200 - (22 - 17.5), 1.6);
+        EXPECT_LT(down.right(), 200);
+    }
+    const QRect small = inkOfCaption(Align::Centre, Run::Across);
+    const QRect large = inkOfCaption(Align::Centre, Run::Across, 10 / 3.0);
+    EXPECT_NEAR(large.left(), small.left() * 10 / 3.0, 4);
+    EXPECT_NEAR(large.width(), small.width() * 10 / 3.0, 6);
+}
+
+TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavidOnPicturesAndSheet) {
+    for (const auto& [name, shows] : {std::pair(u"No Such Family"_s, false), std::pair(u"David"_s, true)}) {
+        PictureCaption caption = captionAt(0, u"שלום Lumora\r\n2024"_s, 24);
+        caption.family = name;
+        Bitmap paper(200, 80, Qt::white);
+        drawInk(paper, inkOf(caption, {200, 80}));
+        EXPECT_EQ(!darkBox(paper).isNull(), shows) << qPrintable(name);
+        Bitmap sheet(200, 80, Qt::white);
+        drawText(sheet, {5, 5}, caption.text, {.family = name, .pixelSize = 24});
+        EXPECT_EQ(darkBox(sheet).height() > 30, shows) << "two lines";
+    }
+}
+
+TEST(CaptionDraw, WhatIsKeptBetweenTicksShowsAsIfItWereMadeAnew) {
+    CaptionInks inks;
+    PictureCaption caption = captionAt(0, u"שלום Lumora\r\n2024"_s, 24);
+    PaperScale scale;
+    const std::function<void()> steps[] = {
+        [&] { caption.x = 40; },
+        [&] { caption.y = 190; },
+        [&] { caption.emSize = 31; },
+        [&] { caption.align = PictureCaption::Align::Centre; },
+        [&] {
+            scale = PaperScale{1.5, 1.5};
+        },
+        [&] { caption.run = PictureCaption::Run::Down; },
+        [&] { caption.colour = Qt::red; },
+        [&] { caption.emSize = 99; }, // larger than the paper: no longer kept
+        [&] { caption.text = u"A"_s; },
+        [&] { caption.family = u"No Such Family"_s; },
+        [&] { caption.family = u"DejaVu Sans"_s; },
+    };
+    for (std::size_t i = 0; i < std::size(steps); ++i) {
+        steps[i]();
+        Bitmap kept(300, 200, Qt::white);
+        Bitmap fresh = kept;
+        drawInk(kept, inks.inkOf(caption, {300, 200}, scale));
+        drawInk(fresh, inkOf(caption, {300, 200}, scale));
+        // Outlines fall on 64ths of a pixel, which may round otherwise at another place.
+        for (int at = 0; at < 300 * 200; ++at) {
+            const auto green = [at](const Bitmap& paper) { return qGreen(paper.image().pixel(at % 300, at / 300)); };
+            ASSERT_NEAR(green(kept), green(fresh), 8) << "step " << i;
+        }
+    }
 }
 
 } // namespace
