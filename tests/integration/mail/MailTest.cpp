@@ -12,8 +12,6 @@
 namespace lumora {
 namespace {
 
-using namespace Qt::StringLiterals;
-
 QByteArray contentOf(const QString& path) {
     QFile file(path);
     EXPECT_TRUE(file.open(QIODevice::ReadOnly)) << path.toStdString();
@@ -48,7 +46,7 @@ protected:
 
     // The same at a server that answers each line with the next reply and then falls silent, or hangs up.
     void expectEnd(int code, const std::vector<std::string>& replies, const char* said, MailEncryption encryption,
-                   bool silent = true) {
+                   bool silent = false) {
         const ScriptedServer server([&](Poco::Net::StreamSocket& client) {
             char bytes[4096];
             for (const std::string& reply : replies) {
