@@ -80,6 +80,7 @@ void kyoskNew::takeBack(const QStringList& basket, const QStringList& pictures) 
     m_choice.takeBack(basket, pictures);
     m_choice.nextPage();
     showPictureCount();
+    showGuide(Guide::PicturesShown);
     const OrderDetails& order = m_state.shemot;
     Text1.text = order.Mail.left(std::max<qsizetype>(0, order.Mail.indexOf(u'@')));
     Text2.text = order.Hearot.left(std::max<qsizetype>(0, order.Hearot.lastIndexOf(u" - "_s)));
