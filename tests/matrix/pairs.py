@@ -10,15 +10,13 @@ from kills import ORDERS
 from relay import Act, Relay
 
 IN_USE = 3   # the program's status where another one has the data folder
-EXCLUSIVE = 'by HTTP no folder is made for one order alone'
 
 
 class Pair(Case):
     """Two orders, each with its own pictures; each has to arrive whole in a folder of its own and to be reported once."""
 
     def __init__(self, tools, number, name, play, order, way, server, careful):
-        literal = EXCLUSIVE if way == 'http' and play is one_serial_empty_folder else ''
-        super().__init__(tools, number, way, server, Fault(f'{name}, {ORDERS[order, way]}', literal=literal), careful)
+        super().__init__(tools, number, way, server, Fault(f'{name}, {ORDERS[order, way]}'), careful)
         self.part, self.order_of, self.plays = 'pair', order, play
         self.other = Workspace(self.folder, tools, way, 'other')
         self.other.data = None
@@ -125,7 +123,7 @@ class Pair(Case):
     def run(self):
         self.as_wanted = False
         super().run()
-        self.good = self.as_wanted and not self.found or bool(self.fault.literal)
+        self.good = self.as_wanted and not self.found
         return self
 
     def play_case(self):
