@@ -80,7 +80,8 @@ int play(int argc, char** argv) {
         return complain(started.failure().message,
                         started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
     ScenarioPlayer player(program, std::move(files), parser.value(u"shots"_s));
-    QObject::connect(&player, &ScenarioPlayer::finished, &application, &QCoreApplication::quit);
+    // quit() would close the window, which may ask the customer.
+    QObject::connect(&player, &ScenarioPlayer::finished, &application, [] { QCoreApplication::exit(); });
     player.start();
     QApplication::exec();
     player.settle();
