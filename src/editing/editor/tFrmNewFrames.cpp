@@ -92,12 +92,13 @@ void tFrmNew::removeFrame() {
 
 void tFrmNew::showFrames(bool on) {
     Misgerett.checked = on;
-    if (m_open && !on && m_seenFrame.takeOut(m_edit)) {
+    const bool takenOut = m_open && !on && m_seenFrame.takeOut(m_edit);
+    if (takenOut) {
         packRenderStore();
         tellFrameTakenOut();
-    } else if (m_open) {
-        RenderPreview();
     }
+    if (m_open && !takenOut)
+        RenderPreview();
     Q_EMIT changed();
 }
 
