@@ -46,18 +46,13 @@ bool isGone(const QString& item, LineForm form, const SessionState& state, const
     return !HasQuestionMark(item) && !pictureIsThere(BasketLine::split(item, form), form, state, files, folder);
 }
 
-bool hasFailed(const Files& files, const OrderFolder& folder) {
-    OrderLog log;
+// The pictures that the log names as failed; no value where it can't be read.
+std::optional<QStringList> failedOf(const Files& files, const OrderFolder& folder) {
     const Result<QByteArray> bytes = files.read(folder.logPath());
-    if (bytes)
-        log.read(*bytes);
-    return !bytes || !log.failed.isEmpty();
-}
-
-QStringList failedOf(const Files& files, const OrderFolder& folder) {
+    if (!bytes)
+        return std::nullopt;
     OrderLog log;
-    if (const Result<QByteArray> bytes = files.read(folder.logPath()))
-        log.read(*bytes);
+    log.read(*bytes);
     return log.failed;
 }
 
@@ -108,7 +103,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
     state.transfer.HazmanaP = inPieces ? 1 : 0;
     state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
     state.transfer.SugMishloah = Sending::NewOrder;
-    state.transfer.leftOut = leftOutOf(failedOf(files, order.folder));
+    state.transfer.leftOut = leftOutOf(failedOf(files, order.folder).value_or(QStringList()));
     state.transfer.leftOutAsked = order.state.phase != Phase::Prepared;
     if (order.state.choices.isEmpty())
         ReadReportDetails(files, order.folder.logPath(), state.shemot);
@@ -138,7 +133,7 @@ Result<void> RemoveReplacedOrder(const Files& files, OrderJournal& order) {
     const OrderFolder replaced(order.folder().path().folder() / name);
     const Result<OrderState> before = ReadOrderState(files, replaced);
     if (before && before->phase <= Phase::Prepared && name != order.folder().name()) {
-        if (hasFailed(files, order.folder()))
+        if (const auto failed = failedOf(files, order.folder()); !failed || !failed->isEmpty())
             return {};
         if (Result<void> removed = files.removeTree(replaced.path()); !removed)
             return removed;
