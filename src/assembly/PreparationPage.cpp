@@ -99,7 +99,7 @@ void PreparationPage::handOver(Outcome toSender) {
             m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
                 .arg(m_state.MisparHazmana);
     if (prepared == Outcome::KeptAtStation && !m_state.transfer.leftOut.isEmpty())
-        m_state.handOver.notice += u' ' + leftOutText(m_state);
+        m_state.handOver.notice += u' ' + LeftOutText(m_state);
     if (!m_chain.follow(id(), prepared))
         m_chain.unload(id());
 }

@@ -9,7 +9,7 @@ namespace lumora {
 struct SessionState;
 
 // The number of pictures that a coupon holds of the size chosen in this order. As built in, a size without a limit, and
-// an album, are measured by the limit of the size that was chosen last, be it by an earlier customer.
+// an album, are measured by the limit of the size that was chosen last, even by an earlier customer.
 class CouponLimit {
 public:
     explicit CouponLimit(SessionState& state)
@@ -17,8 +17,8 @@ public:
 
     // A new order, for which no size is chosen yet.
     void begin() const;
-    // A size that is placed in front, or one of the list, was chosen. The limit from now on, 0 for a size without a
-    // coupon; no value where the one before goes on to hold.
+    // A size in front, or one of the list, was chosen. Gives the limit from now on: 0 for a size without one, no value
+    // where the earlier limit stays.
     std::optional<int> takeQuickSize(const QString& size) const;
     std::optional<int> takeListedSize() const;
     // The order's copies must match the limit.

@@ -71,8 +71,10 @@ void LeftOutBox::goBack() {
         return;
     }
     m_state.handOver.back = true;
-    m_chain.follow(m_page, Outcome::PicturesWanted);
-    removeOrder();
+    if (m_chain.follow(m_page, Outcome::PicturesWanted))
+        removeOrder();
+    else
+        m_state.handOver.back = false;
 }
 
 // The thumbnails of the order sheet go too, since the next sheet shows all that are there.
@@ -90,10 +92,10 @@ void LeftOutBox::removeOrder() {
     m_state.transfer.leftOut.clear();
 }
 
-QList<LeftOut> leftOutOf(const QStringList& failed) {
+QList<LeftOut> LeftOutOf(const QStringList& failed) {
     QList<LeftOut> pictures;
     for (const QString& path : failed)
-        pictures += LeftOut{DrivePath(path), HasQuestionMark(path) ? LeftOut::Why::Name : LeftOut::Why::Damaged};
+        pictures += LeftOut{DrivePath(path), HasQuestionMark(path) ? LeftOut::Why::Name : LeftOut::Why::NotTold};
     return pictures;
 }
 

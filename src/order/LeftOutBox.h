@@ -65,9 +65,9 @@ private:
 };
 
 // The pictures that the log names as failed, as left out.
-QList<LeftOut> leftOutOf(const QStringList& failed);
+QList<LeftOut> LeftOutOf(const QStringList& failed);
 
 // How many pictures are not in the order, as a sentence; empty for none.
-QString leftOutText(const SessionState& state);
+QString LeftOutText(const SessionState& state);
 
 } // namespace lumora

@@ -20,13 +20,15 @@ QString reasonText(const SessionState& state, LeftOut::Why why) {
         return state.wording(u"לא ניתן לקרוא את הקובץ", u"the file can't be read");
     case LeftOut::Why::NotWritten:
         return state.wording(u"לא ניתן היה לשמור אותה במחשב זה", u"it could not be stored on this computer");
+    case LeftOut::Why::NotTold:
+        return state.wording(u"לא ניתן היה להכין אותה להדפסה", u"it could not be prepared for printing");
     }
     return {};
 }
 
 } // namespace
 
-QString leftOutText(const SessionState& state) {
+QString LeftOutText(const SessionState& state) {
     const qsizetype count = state.transfer.leftOut.size();
     if (count == 0)
         return {};
@@ -39,7 +41,7 @@ QString leftOutText(const SessionState& state) {
 void LeftOutBox::show() {
     const bool one = m_state.transfer.leftOut.size() == 1;
     const bool withoutPrints = m_order == Order::WithoutPrints;
-    m_shown.Label4Kartis.text = leftOutText(m_state);
+    m_shown.Label4Kartis.text = LeftOutText(m_state);
     m_shown.Label4Kartis.visible = !m_shown.Label4Kartis.text.isEmpty();
     m_shown.Label4Hasserot.text = withoutPrints
                                       ? m_state.wording(u"אין בהזמנה אף תמונה שניתן להדפיס, ולכן היא לא תישלח.",

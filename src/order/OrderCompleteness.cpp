@@ -73,10 +73,8 @@ OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& 
 
 OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked) {
     const QStringList present = files.names(folder.path(), u"*.jpp;*.prk"_s);
-    OrderLog log;
-    if (const Result<QByteArray> bytes = files.read(folder.logPath()))
-        log.read(*bytes);
-    return of(log.Hazmana.isEmpty() ? nullptr : &log, present, marked);
+    const std::optional<OrderLog> log = ReadOrderLog(files, folder);
+    return of(log ? &*log : nullptr, present, marked);
 }
 
 } // namespace lumora

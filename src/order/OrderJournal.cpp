@@ -92,7 +92,7 @@ Result<void> OrderJournal::prepared() {
 Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
     makeKnown();
     OrderState next = m_state;
-    next.makesFolder = false;
+    next.folderAsked.reset();
     next.phase = std::max(next.phase, Phase::Sending);
     if (next.way == Way::Station || next.way == Way::Mail)
         next.way = wayOf(by);
@@ -110,21 +110,23 @@ bool OrderJournal::ownsFolder(Sender by) const {
     return m_state.folderMadeByUs && m_state.way == wayOf(by);
 }
 
-Result<void> OrderJournal::folderIsAsked() {
+Result<void> OrderJournal::folderIsAsked(Sender by) {
     makeKnown();
     OrderState next = m_state;
-    next.makesFolder = !next.folderMadeByUs;
+    next.folderAsked = ownsFolder(by) ? std::nullopt : std::optional(by);
     return keep(next);
 }
 
 Result<void> OrderJournal::folderIsRefused() {
     makeKnown();
     OrderState next = m_state;
-    next.makesFolder = false;
+    next.folderAsked.reset();
     return keep(next);
 }
 
-Result<void> OrderJournal::folderIsLost() {
+Result<void> OrderJournal::folderIsLost(Sender by) {
+    if (!ownsFolder(by))
+        return {};
     OrderState next = m_state;
     next.folderMadeByUs = false;
     return keep(next);

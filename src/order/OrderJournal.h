@@ -37,13 +37,17 @@ public:
     Result<void> sendingBegins(Sender by, bool ours);
     // The folder on this sender's server is known as the order's own. One that was made for the other sender is not.
     bool ownsFolder(Sender by) const;
-    // The server is about to be asked to make the folder; it has refused.
-    Result<void> folderIsAsked();
+    // This sender's server is about to be asked for the folder; it has refused.
+    Result<void> folderIsAsked(Sender by);
     Result<void> folderIsRefused();
-    // Another order has taken it since: nothing more of this one may go there.
-    Result<void> folderIsLost();
+    // Asked there, and the answer is not known.
+    bool mayHaveMadeFolder(Sender by) const { return m_state.folderAsked == by; }
+    // Another order has taken the folder on this sender's server: nothing more of this one may go there.
+    Result<void> folderIsLost(Sender by);
     // The customer sends the order again: without a state, it was sent by an older version. Writes nothing by itself.
     void markSentAgain() { m_sentAgain = true; }
+    // An older version may have sent the order.
+    bool wasSentBefore() const { return m_state.sentBefore || (!m_known && m_sentAgain); }
     // A file's full path, before its put and after the put that was confirmed.
     Result<void> take(const QString& path);
     Result<void> release(const QString& path);

@@ -2,11 +2,14 @@
 
 #include "common/FixedText.h"
 #include "common/ListOutput.h"
+#include "order/OrderFolder.h"
 #include "order/OrderNames.h"
+#include "platform/files/Files.h"
 
 #include <QList>
 
 #include <algorithm>
+#include <utility>
 #include <variant>
 
 namespace lumora {
@@ -193,6 +196,13 @@ void OrderLog::read(const QByteArray& bytes) {
     }
     if (layout == Layout::Edited)
         Optint = OrderKind::EditedPrint;
+}
+
+std::optional<OrderLog> ReadOrderLog(const Files& files, const OrderFolder& folder) {
+    OrderLog log;
+    if (const Result<QByteArray> bytes = files.read(folder.logPath()))
+        log.read(*bytes);
+    return log.Hazmana.isEmpty() ? std::nullopt : std::optional(std::move(log));
 }
 
 } // namespace lumora

@@ -12,6 +12,9 @@
 
 namespace lumora {
 
+class Files;
+class OrderFolder;
+
 // The order log: the customer, the order's options, the failed pictures and the whole basket. The lab's tools read it,
 // and the senders when an order is sent again. docs/formats.md has its tables.
 struct OrderLog {
@@ -45,5 +48,8 @@ struct OrderLog {
         return BasketLine::split(items[index], layout == Layout::Edited ? LineForm::Full : LineForm::Short);
     }
 };
+
+// The order's log; none where it can't be read or names no order.
+std::optional<OrderLog> ReadOrderLog(const Files& files, const OrderFolder& folder);
 
 } // namespace lumora

@@ -16,6 +16,7 @@ namespace {
 
 constexpr std::array phases = {"preparing", "prepared", "sending", "arrived", "reported"};
 constexpr std::array ways = {"ftp", "http", "station", "mail"};
+constexpr std::array senders = {"ftp", "http"};
 constexpr std::array reports = {"not yet", "begun", "done"};
 
 const QString choicePrefix = u"Choice."_s;
@@ -83,8 +84,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         return takeWord(ways, value, state.way);
     if (key == u"Report")
         return takeWord(reports, value, state.report);
-    if (key == u"MakesFolder")
-        return takeTruth(value, state.makesFolder);
+    if (key == u"FolderAsked")
+        return takeWord(senders, value, state.folderAsked.emplace());
     if (key == u"FolderMadeByUs")
         return takeTruth(value, state.folderMadeByUs);
     if (key == u"FewerAgreed")
@@ -129,8 +130,8 @@ QByteArray OrderState::write() const {
     writer.text(u"Shemot.ser"_s, serial);
     writer.text(u"Optint"_s, QString::number(static_cast<int>(kind)));
     writer.word("Way", ways, way);
-    if (makesFolder)
-        writer.truth("MakesFolder", true);
+    if (folderAsked)
+        writer.word("FolderAsked", senders, *folderAsked);
     writer.truth("FolderMadeByUs", folderMadeByUs);
     if (fewerAgreed)
         writer.truth("FewerAgreed", true);

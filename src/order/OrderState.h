@@ -7,6 +7,8 @@
 #include <QByteArray>
 #include <QStringList>
 
+#include <optional>
+
 namespace lumora {
 
 class Files;
@@ -32,7 +34,9 @@ struct OrderState {
     QString serial; // Shemot.ser
     OrderKind kind = OrderKind::NotChosen;
     Way way = Way::Ftp;
-    bool makesFolder = false; // the server was about to be asked for the folder, and the answer is not known
+    // The server of this sender was about to be asked for the folder (by HTTP: the log was about to be posted), and the
+    // answer is not known.
+    std::optional<Sender> folderAsked;
     // The folder on the server is known as this order's own: made by it, or recognised (docs/guards.md).
     bool folderMadeByUs = false;
     bool fewerAgreed = false;      // all files of its folder arrived; the customer agreed that the log names more
@@ -46,6 +50,11 @@ struct OrderState {
     QStringList items;              // lines of the basket; kept until the sending begins
     QList<ListOutputEntry> choices; // as OrderChoices has them; kept until the lab was told
     QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
+
+    // Whole, or with the fewer pictures that the customer has agreed to.
+    bool hasArrived() const { return phase >= Phase::Arrived || fewerAgreed; }
+    // No telling of the lab was begun yet.
+    bool onlyReportIsLeft() const { return hasArrived() && phase < Phase::Reported && report == Report::NotYet; }
 
     bool operator==(const OrderState&) const = default;
 

@@ -17,6 +17,7 @@ struct OrderDetails;
 struct PrintCode {
     static constexpr int width = 9;
     static constexpr int copiesWidth = 2;
+    static constexpr int paperAt = copiesWidth + 4; // behind copies and size code
     static constexpr int mostCopies = 99;
 
     int copies = 0;
@@ -28,7 +29,7 @@ struct PrintCode {
     // The copies of a basket line or print file's name; 0 when the first two characters are no number.
     static int copiesOf(const QString& line);
     // The paper letter of a basket line or print file's name.
-    static QChar paperOf(const QString& line) { return line.size() < width ? QChar(u' ') : line[6]; }
+    static QChar paperOf(const QString& line) { return line.size() < width ? QChar(u' ') : line[paperAt]; }
     // The copies as two characters.
     static QString copiesField(int copies) { return LeftField(QString::number(copies), copiesWidth); }
 };

@@ -12,7 +12,7 @@ QString TailTelephone::of(const QString& typed) const {
     return m_state.Careful ? squeezed(typed) : typed;
 }
 
-bool TailTelephone::mayBe(const QString& typed, Dialogs& dialogs) const {
+bool TailTelephone::mayGoOnWith(const QString& typed, Dialogs& dialogs) const {
     const QString number = AnsiCodePage::squeeze(of(typed.trimmed()));
     if (!m_state.Careful || number.size() <= width)
         return true;

@@ -18,10 +18,11 @@ public:
 
     // The number for the tail, not yet cut to its width.
     QString of(const QString& typed) const;
-    // Asks the customer where the tail would still cut the number; false: it is to be set right.
-    bool mayBe(const QString& typed, Dialogs& dialogs) const;
+    // Asks the customer where the tail would still cut the number. False: the customer wants to correct it.
+    bool mayGoOnWith(const QString& typed, Dialogs& dialogs) const;
 
-    // A number of more than ten characters with 0 in place of "+972", then without hyphens and blanks.
+    // A number of more than ten characters gets 0 in place of "+972" and loses hyphens and blanks; a shorter one stays
+    // as it is.
     static QString squeezed(const QString& typed);
 
 private:

@@ -48,12 +48,8 @@ bool isGone(const QString& item, LineForm form, const SessionState& state, const
 
 // The pictures that the log names as failed; no value where it can't be read.
 std::optional<QStringList> failedOf(const Files& files, const OrderFolder& folder) {
-    const Result<QByteArray> bytes = files.read(folder.logPath());
-    if (!bytes)
-        return std::nullopt;
-    OrderLog log;
-    log.read(*bytes);
-    return log.failed;
+    const std::optional<OrderLog> log = ReadOrderLog(files, folder);
+    return log ? std::optional(log->failed) : std::nullopt;
 }
 
 bool canBeSent(const SessionState& session, const OrderState& state) {
@@ -69,8 +65,8 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
         return false;
     if (state.sentBefore)
         return false;
-    if (state.phase == Phase::Arrived || state.fewerAgreed)
-        return state.report == OrderState::Report::NotYet;
+    if (state.hasArrived())
+        return state.onlyReportIsLeft();
     const QStringList names = files.names(order.folder.path(), u"*"_s);
     return OrderCompleteness::read(files, order.folder, names).verdict() != OrderCompleteness::Verdict::None;
 }
@@ -103,7 +99,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
     state.transfer.HazmanaP = inPieces ? 1 : 0;
     state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
     state.transfer.SugMishloah = Sending::NewOrder;
-    state.transfer.leftOut = leftOutOf(failedOf(files, order.folder).value_or(QStringList()));
+    state.transfer.leftOut = LeftOutOf(failedOf(files, order.folder).value_or(QStringList()));
     state.transfer.leftOutAsked = order.state.phase != Phase::Prepared;
     if (order.state.choices.isEmpty())
         ReadReportDetails(files, order.folder.logPath(), state.shemot);
@@ -111,7 +107,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
 
 } // namespace
 
-void tidyOrders(const SessionState& state, const Files& files) {
+void TidyOrders(const SessionState& state, const Files& files) {
     const DrivePath orders = WorkspacePaths::orders(state);
     const QStringList names = files.folders(orders);
     for (const QString& name : names) {
@@ -221,7 +217,7 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
     return unfinished;
 }
 
-Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files) {
+Outcome TakeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files) {
     TakeChoices(order.state.choices, state);
     if (order.state.phase == Phase::Preparing) {
         takeUpPreparation(order, state);
@@ -234,14 +230,14 @@ Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Fil
 bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const Files& files, PageChain& chain,
                    PageId from) {
     const SessionState before = state;
-    const Outcome way = takeUpOrder(order, state, files);
+    const Outcome way = TakeUpOrder(order, state, files);
     if (chain.canFollow(from, way) && chain.follow(from, way))
         return true;
     state = before;
     return false;
 }
 
-Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder) {
+Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder) {
     return files.removeTree(folder.path());
 }
 

@@ -20,7 +20,7 @@ struct SessionState;
 // Removes what a killed program has left among the orders: orders that were prepared again under another number,
 // claimed folders that hold nothing, and logs that were fetched from a server. Only for a data folder in which no other
 // program runs: a folder that another program has just claimed is empty too.
-void tidyOrders(const SessionState& state, const Files& files);
+void TidyOrders(const SessionState& state, const Files& files);
 
 // An order whose preparation or sending did not come to its end.
 struct UnfinishedOrder {
@@ -45,23 +45,22 @@ UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files,
 QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& files);
 
 // Sets the session for going on with the order, and tells the way to the page that does it.
-Outcome takeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files);
-// Does so and follows that way. False where it leads nowhere; the session is as before then.
+Outcome TakeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files);
+// Takes the order up and goes to its page. False where that page is not registered; the session is unchanged then.
 bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const Files& files, PageChain& chain,
                    PageId from);
 
-// The order that was prepared again from this one, whose number is another order's on the server. None where this one
-// was sent after all.
+// The order that was prepared again from this one under another number; none where this one has been sent.
 std::optional<OrderFolder> ReplacementOf(const SessionState& state, const Files& files, const OrderFolder& folder);
-// Removes the order that this one was prepared again from, once this one is whole. One that was sent meanwhile is an
-// order of its own; one stays while a picture of this order has failed, since it may hold the only print.
+// Removes the order that this one was prepared again from. A replaced order that was sent stays, and so does one whose
+// successor has a failed picture, since it may hold the only print.
 Result<void> RemoveReplacedOrder(const Files& files, OrderJournal& order);
 
 // "2 of 5 pictures are no longer where they were.", and the question before an order is thrown away.
 QString GoneText(const SessionState& state, const UnfinishedOrder& order);
 QString ThrowAwayQuestion(const SessionState& state, const QString& number);
 // Removes the order's folder with all that it holds.
-Result<void> throwAwayOrder(const Files& files, const OrderFolder& folder);
+Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder);
 
 // How many pictures of the order's basket are no longer where they were, whether their prints are there or not.
 int GonePictures(const SessionState& state, const Files& files, const UnfinishedOrder& order);

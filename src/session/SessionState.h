@@ -179,7 +179,7 @@ enum class Travel : std::int16_t { Whole = 0, Pieces = 1 };
 
 // A chosen picture that is not in the order that was prepared, and why.
 struct LeftOut {
-    enum class Why : std::int16_t { NoJpeg, Name, Gone, Damaged, NotWritten };
+    enum class Why : std::int16_t { NoJpeg, Name, Gone, Damaged, NotWritten, NotTold };
     DrivePath picture;
     Why why = Why::Damaged;
 };

@@ -15,7 +15,7 @@ using namespace Qt::StringLiterals;
 void hatchala::offerUnfinished() {
     if (m_platform.instances.another())
         return;
-    tidyOrders(m_state, m_platform.files);
+    TidyOrders(m_state, m_platform.files);
     if (!m_state.offerPutOff)
         m_unfinished = UnfinishedOrders(m_state, m_platform.files);
 }
@@ -54,7 +54,7 @@ void hatchala::throwOrderAway() {
     const UnfinishedOrder order = m_unfinished.first();
     if (!asksToThrowAway(order.state.number) || m_leaving)
         return;
-    if (const Result<void> gone = throwAwayOrder(m_platform.files, order.folder); !gone)
+    if (const Result<void> gone = ThrowAwayOrder(m_platform.files, order.folder); !gone)
         m_platform.dialogs.message(gone.failure().message);
     m_asksForGone = false;
     m_unfinished = UnfinishedOrders(m_state, m_platform.files);

@@ -39,7 +39,7 @@ protected:
         state = next;
         const QList<UnfinishedOrder> found = UnfinishedOrders(state, machine.files);
         EXPECT_EQ(found.size(), 1);
-        const bool edits = takeUpOrder(found.first(), state, machine.files) == Outcome::EditedTakenUp;
+        const bool edits = TakeUpOrder(found.first(), state, machine.files) == Outcome::EditedTakenUp;
         chain.show(edits ? PageId::B3 : PageId::Form2);
         start(*dynamic_cast<PreparationPage*>(chain.front()));
         EXPECT_EQ(front(), PageId::FtpFrm);

@@ -48,8 +48,8 @@ TEST_F(AJournal, keepsEachStepAndWritesNothingWhereNothingChanges) {
          },
          Phase::Preparing, 0, Report::NotYet, 2},
         {"prepared", [](OrderJournal& journal) { return journal.prepared(); }, Phase::Prepared, 0, Report::NotYet, 2},
-        {"folder asked for", [](OrderJournal& journal) { return journal.folderIsAsked(); }, Phase::Prepared, 0,
-         Report::NotYet, 2},
+        {"folder asked for", [](OrderJournal& journal) { return journal.folderIsAsked(Sender::Http); }, Phase::Prepared,
+         0, Report::NotYet, 2},
         {"sending", [](OrderJournal& journal) { return journal.sendingBegins(Sender::Http, true); }, Phase::Sending, 0,
          Report::NotYet, 0},
         {"take", [](OrderJournal& journal) { return journal.take(printPath); }, Phase::Sending, 1, Report::NotYet, 0},
@@ -73,7 +73,7 @@ TEST_F(AJournal, keepsEachStepAndWritesNothingWhereNothingChanges) {
         EXPECT_EQ(state.report, step.report) << step.what;
         EXPECT_EQ(state.items.size(), step.lines) << step.what;
         EXPECT_EQ(state.number + state.serial + state.replaces, u"1051234old"_s) << step.what;
-        EXPECT_EQ(state.makesFolder, &step == &steps[2]) << step.what;
+        EXPECT_EQ(state.folderAsked == Sender::Http, &step == &steps[2]) << step.what;
         EXPECT_EQ(state.folderMadeByUs, step.phase >= Phase::Sending) << step.what;
         EXPECT_EQ(state.way, step.phase >= Phase::Sending ? Way::Http : Way::Station) << step.what;
         ASSERT_TRUE(test.files.removeFile(folder.filePath(u".order"_s)));
@@ -105,9 +105,15 @@ TEST_F(AJournal, knowsTheFolderOfTheServerOnWhichItWasMade) {
     give(u"!105_1234.jpg"_s);
     OrderJournal journal(test.files, folder);
     ASSERT_TRUE(journal.sendingBegins(Sender::Ftp, true));
-    EXPECT_FALSE(journal.ownsFolder(Sender::Ftp) || journal.ownsFolder(Sender::Http)) << "made for the other sender";
+    EXPECT_FALSE(journal.ownsFolder(Sender::Ftp)) << "made for the other sender";
+    EXPECT_FALSE(journal.ownsFolder(Sender::Http));
+    ASSERT_TRUE(journal.folderIsAsked(Sender::Ftp));
+    EXPECT_TRUE(journal.mayHaveMadeFolder(Sender::Ftp));
+    EXPECT_FALSE(journal.mayHaveMadeFolder(Sender::Http));
     ASSERT_TRUE(journal.sendingBegins(Sender::Http, true));
-    EXPECT_TRUE(journal.ownsFolder(Sender::Http) && !journal.ownsFolder(Sender::Ftp));
+    ASSERT_TRUE(journal.folderIsLost(Sender::Ftp));
+    EXPECT_TRUE(journal.ownsFolder(Sender::Http));
+    EXPECT_FALSE(journal.ownsFolder(Sender::Ftp));
 }
 
 TEST_F(AJournal, takesAwayWhatWasKeptAsideWhenTheSendingBegins) {

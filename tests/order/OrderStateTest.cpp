@@ -44,7 +44,8 @@ TEST(AnOrderState, keepsEachStepOfTheSendingAndDropsTheBasketWhenItBegins) {
         OrderState state = unfinished();
         state.phase = phase;
         state.way = OrderState::Way::Station;
-        state.folderMadeByUs = state.provenByNameOnly = state.makesFolder = state.fewerAgreed = state.sentBefore = true;
+        state.folderMadeByUs = state.provenByNameOnly = state.fewerAgreed = state.sentBefore = true;
+        state.folderAsked = Sender::Http;
         if (phase == Phase::Sending)
             state.filesSent = 3, state.filesInAll = 7;
         state.filesInHand = {u"C:\\a.jpp"_s, u"C:\\ב.jpp"_s};

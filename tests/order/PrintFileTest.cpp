@@ -128,7 +128,8 @@ TEST(OrderTail, carriesTenDigitsOfALongTelephoneAndAsksForMore) {
             state.Careful = careful;
             EXPECT_EQ(OrderTail::parse(OrderTail::of(state).shortForm())->telephone, careful ? c.careful : c.builtIn);
             RecordedDialogs dialogs;
-            EXPECT_EQ(TailTelephone(state).mayBe(c.typed, dialogs), !(careful && c.asks)) << c.typed.toStdString();
+            EXPECT_EQ(TailTelephone(state).mayGoOnWith(c.typed, dialogs), !(careful && c.asks))
+                << c.typed.toStdString();
             EXPECT_EQ(dialogs.questions.size(), careful && c.asks ? 1 : 0);
         }
     }

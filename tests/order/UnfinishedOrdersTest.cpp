@@ -88,7 +88,7 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     underWay.replaces = name;
     give(name, inPhase(Phase::Prepared), {print});
     give(u"2026_11_21_KUP_1234^106"_s, underWay);
-    tidyOrders(session, test.files);
+    TidyOrders(session, test.files);
     EXPECT_EQ(test.files.folders(orders),
               QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name, "2026_11_21_KUP_1234^106",
                            lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
@@ -134,12 +134,12 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
             state.*c.flag = true;
         const OrderFolder folder = give(name, state, c.withPrint ? QStringList(print) : QStringList());
         EXPECT_EQ(offered(), c.offered ? QStringList(name) : QStringList()) << (&c - cases);
-        ASSERT_TRUE(throwAwayOrder(test.files, folder));
+        ASSERT_TRUE(ThrowAwayOrder(test.files, folder));
     }
     session.profile.FtpUser.clear();
     const OrderFolder noServer = give(name, inPhase(Phase::Sending), {print});
     EXPECT_TRUE(offered().isEmpty()) << "there is no server to go on with";
-    ASSERT_TRUE(throwAwayOrder(test.files, noServer));
+    ASSERT_TRUE(ThrowAwayOrder(test.files, noServer));
     give(name, {print, u".order"_s}); // damaged
     give(u"2026_11_20_KUP_1234^9"_s, inPhase(Phase::Preparing, u"9"_s));
     give(u"2026_11_21_KUP_1234^99"_s, inPhase(Phase::Preparing, u"99"_s));
@@ -161,7 +161,7 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
 
     SessionState next;
     next.DiskRoot = session.DiskRoot;
-    EXPECT_EQ(takeUpOrder(found[0], next, test.files), Outcome::PlainTakenUp);
+    EXPECT_EQ(TakeUpOrder(found[0], next, test.files), Outcome::PlainTakenUp);
     EXPECT_EQ(next.handOver.lines, found[0].state.items);
     EXPECT_EQ(next.handOver.takenUp, orders / name);
     EXPECT_TRUE(next.handOver.pressStart);
@@ -169,14 +169,14 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
 
     UnfinishedOrder order = found[0];
     order.state.kind = OrderKind::EditedPrint;
-    EXPECT_EQ(takeUpOrder(order, next, test.files), Outcome::EditedTakenUp);
+    EXPECT_EQ(TakeUpOrder(order, next, test.files), Outcome::EditedTakenUp);
     for (const Way way : {Way::Ftp, Way::Http}) {
         OrderState state = inPhase(Phase::Sending);
         state.way = way;
         const OrderFolder folder = give(name + u'P', state);
         SessionState sending;
         sending.transfer.SugMishloah = Sending::Resend;
-        EXPECT_EQ(takeUpOrder({folder, *ReadOrderState(test.files, folder)}, sending, test.files),
+        EXPECT_EQ(TakeUpOrder({folder, *ReadOrderState(test.files, folder)}, sending, test.files),
                   way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp);
         EXPECT_EQ(sending.transfer.OrderFolder, folder.path());
         EXPECT_EQ(sending.transfer.ShemTikiya, name + u'P');

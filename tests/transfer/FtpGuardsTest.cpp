@@ -244,7 +244,8 @@ TEST(FtpGuards, AnOrderThatArrivedBeforeIsOnlyReported) {
 TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
     using Phase = OrderState::Phase;
     const QByteArray otherLog = "\"00\",\"00\"\r\n\"Shemot.n1\",\"Someone else\"\r\n";
-    const auto askFor = [](Guarded& order) { EXPECT_TRUE(order.journal().folderIsAsked()); };
+    const auto askFor = [](Guarded& order) { EXPECT_TRUE(order.journal().folderIsAsked(Sender::Ftp)); };
+    const auto postTo = [](Guarded& order) { EXPECT_TRUE(order.journal().folderIsAsked(Sender::Http)); };
     struct Case {
         const char* what;
         std::function<void(Guarded&)> arrange;
@@ -280,6 +281,7 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
         {"an empty folder", [](Guarded&) {}, false},
         {"an empty folder, and killed before the answer to its making", askFor, true},
         {"an empty folder, and its making refused", refused, false},
+        {"an empty folder, and its log posted to the web server", postTo, false},
         {"an empty folder of an older version", older, true},
         {"a refused listing", unread, false},
         {"a refused listing, and killed before the answer to its making", askedAndUnread, true},

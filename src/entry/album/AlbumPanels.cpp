@@ -135,7 +135,7 @@ void AlbumPanels::leavePhotographer() {
 bool AlbumPanels::telephoneMayBe() {
     if (m_state.albumTail != AlbumTail::Photographer)
         return true;
-    const bool fits = TailTelephone(m_state).mayBe(Text1[1].text, m_platform.dialogs);
+    const bool fits = TailTelephone(m_state).mayGoOnWith(Text1[1].text, m_platform.dialogs);
     if (!Pic4Alboom.visible)
         return false;
     if (!fits)

@@ -228,7 +228,7 @@ void nnn::leaveDetails() {
 
 // A question's loop may close the page.
 bool nnn::telephoneMayBe() {
-    const bool fits = TailTelephone(m_state).mayBe(Text3.text, m_platform.dialogs);
+    const bool fits = TailTelephone(m_state).mayGoOnWith(Text3.text, m_platform.dialogs);
     if (m_leaving || m_chain.hasEnded())
         return false;
     if (!fits)

@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-int UnsentPackages::toGoOnWith(const PackageWalk& walk) const {
+int UnsentPackages::count(const PackageWalk& walk) const {
     const int sent = walk.count(PackageWalk::Fate::Sent);
     return m_state.Careful && sent > 0 ? walk.count() - sent : 0;
 }

@@ -13,7 +13,7 @@ public:
         : m_state(state) {}
 
     // How many there are to go on with; 0 where none was sent before.
-    int toGoOnWith(const PackageWalk& walk) const;
+    int count(const PackageWalk& walk) const;
 
 private:
     const SessionState& m_state;

@@ -60,7 +60,7 @@ void MoogMeret::offerToThrowAway(const OrderFolder& folder) {
     const QString number = order ? order->number : OrderNumberOf(folder.name());
     if (!mayAct() || !asksToThrowAway(number))
         return;
-    if (const Result<void> gone = throwAwayOrder(m_platform.files, folder); !gone)
+    if (const Result<void> gone = ThrowAwayOrder(m_platform.files, folder); !gone)
         m_platform.dialogs.message(gone.failure().message);
     refreshOrders();
 }

@@ -58,7 +58,7 @@ bool MoogMeret::mayBeMailed() {
 
 // After a stop, with the same files marked, the customer chooses whether what was sent is sent again.
 bool MoogMeret::asksToGoOn() {
-    const int unsent = m_phase == Phase::Walked ? UnsentPackages(m_state).toGoOnWith(m_walk) : 0;
+    const int unsent = m_phase == Phase::Walked ? UnsentPackages(m_state).count(m_walk) : 0;
     return unsent > 0 && List1.items() == m_files.mailList() &&
            asks(u"נשארו %1 מנות שלא נשלחו. כן: להמשיך בהן. לא: להתחיל מחדש.",
                 u"%1 packages were not sent. Yes: go on with them. No: begin again.", {QString::number(unsent)}) &&

@@ -13,8 +13,8 @@ class EventPump;
 struct SendingStop {
     // The customer has left the page or the program: every loop ends at its next step, and nothing more is sent.
     bool left = false;
-    // The customer has pressed stop. It is read before and during each file, between two tries to connect, in each
-    // pause, and after a check; it is reset where a file begins.
+    // The customer has pressed stop, or the line was silent for too long. It is read before and during each file,
+    // between two tries to connect, in each pause, and after a check; it is reset where a file begins.
     bool StopFlag = false;
 };
 

@@ -11,7 +11,8 @@ struct SessionState;
 // The step of the transfer that failed. File: a file of the order can't be read or its name can't be sent. Confirm: the
 // connection held, but the server's list does not confirm that all files arrived. KeepList: the server's list could not
 // be written on this machine. ServerChanges: the server stores other bytes than were sent. ForeignFolder: the server
-// has another order under this one's name. Silence: the line stood still or went too slowly for too long.
+// has another order under this one's name, and nothing of this one was sent. FolderLost: it has come since. Silence:
+// the line stood still or went too slowly for too long.
 enum class LineStep {
     Open,
     Connect,
@@ -23,6 +24,7 @@ enum class LineStep {
     KeepList,
     ServerChanges,
     ForeignFolder,
+    FolderLost,
     Silence
 };
 

@@ -72,6 +72,11 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
         return state.wording(u"בשרת כבר יש הזמנה אחרת בשם זה, ולכן לא נשלח דבר. יש להתקשר למעבדה."_s,
                              u"The server already holds another order under this name, so nothing was sent. Please "
                              u"call the lab."_s);
+    case LineStep::FolderLost:
+        return state.wording(
+            u"הזמנה אחרת באותו שם נכנסה לתיקייה שבשרת, וייתכן שהזמנה זו אינה שלמה שם. יש להתקשר למעבדה."_s,
+            u"Another order of the same name has come into the folder on the server, so this one may not be whole "
+            u"there. Please call the lab."_s);
     case LineStep::Silence:
         return state.wording(u"השרת אינו עונה או שהקו איטי מדי, ולכן השליחה הופסקה. יש לנסות שוב מאוחר יותר."_s,
                              u"The server does not answer or the line is too slow, so the sending has ended. Please "

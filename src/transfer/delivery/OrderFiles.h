@@ -9,9 +9,12 @@ class DrivePath;
 class Files;
 class OrderFolder;
 
+// What the FTP page lists of an order's folder.
+inline const QString ftpOrderPattern = QStringLiteral("*.gbr;*.jpp;*.prk");
+
 // The files of a folder in the order in which FTP sends them: the order log, then the print files. Of an order in
 // pieces the sheet and the pieces follow the log; without a sheet the folder itself stands in its place, and its put
-// fails. entries: the folder's names that match the sending page's pattern.
+// fails. entries: the folder's names that match ftpOrderPattern.
 QStringList FtpOrderFiles(const Files& files, const OrderFolder& order, const QStringList& entries, bool inPieces);
 
 // The same for the older bulk path, chosen from the paths that the page of finished orders handed over.

@@ -25,6 +25,7 @@ bool PreparedAgain::handOver(const IsTaken& isTaken) {
     const OrderState& kept = m_order.state();
     const bool plain = printsAsTheyAre(kept.kind);
     const auto ending = plain ? OrderFolder::Ending::BySession : OrderFolder::Ending::Plain;
+    const SessionState before = m_state;
     TakeChoices(kept.choices, m_state);
     for (double number = Val(kept.number) + 1.0;; ++number) {
         m_state.MisparHazmana = QString::number(number, 'f', 0);
@@ -33,7 +34,7 @@ bool PreparedAgain::handOver(const IsTaken& isTaken) {
             continue;
         const std::optional<bool> taken = isTaken(folder.name());
         if (!taken) {
-            m_state.MisparHazmana = kept.number;
+            m_state = before;
             return false;
         }
         if (!*taken)

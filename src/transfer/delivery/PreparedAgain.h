@@ -30,7 +30,8 @@ public:
 
     // Whether the server has a folder of this name; no value where it does not tell.
     using IsTaken = std::function<std::optional<bool>(const QString& name)>;
-    // Gives the session the number, basket and choices. False where the server does not tell of a free number.
+    // Gives the session the number, basket and choices. False where the server does not tell of a free number; the
+    // session is unchanged then.
     bool handOver(const IsTaken& isTaken);
 
 private:

@@ -23,7 +23,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int whileAPumpRuns = 20; // milliseconds
+// Milliseconds.
+constexpr int pumpRetry = 20;
 constexpr int reportTick = 1000;
 
 } // namespace
@@ -56,7 +57,7 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
 // While the page before still runs a pump, clicks would not reach this page.
 void SendingPage::activateWhenFree() {
     if (m_platform.pump.pumping())
-        QTimer::singleShot(whileAPumpRuns, this, &SendingPage::activateWhenFree);
+        QTimer::singleShot(pumpRetry, this, &SendingPage::activateWhenFree);
     else
         activate();
 }
@@ -91,6 +92,8 @@ QString SendingPage::advice(const PhaseLook& row) const {
 
 // An order that lacks chosen pictures is not called whole.
 QString SendingPage::adviceOf(const PhaseLook& row) const {
+    if (row.phase == SendingPhase::Waiting && isAnswerAwaited())
+        return wording(answerAwaitedAdvice);
     const QString text = advice(row);
     if (m_state.transfer.leftOut.isEmpty())
         return text;
@@ -100,7 +103,7 @@ QString SendingPage::adviceOf(const PhaseLook& row) const {
 }
 
 void SendingPage::goOnWithout() {
-    if (!m_shown.leftOut.Pic4Hasserot.visible)
+    if (!m_leftOut.isOpen())
         return;
     const bool awaited = isAnswerAwaited();
     m_leftOut.goOnWithout();

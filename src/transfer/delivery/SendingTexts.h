@@ -19,6 +19,8 @@ inline constexpr SendingWords noServerAdvice{
     u"No server is set for orders. The order is kept on this computer. Please tell the shop."};
 inline constexpr SendingWords readyAdvice{u"ההזמנה מוכנה. השליחה תתחיל מעצמה בתום הספירה.",
                                           u"The order is ready. Sending begins by itself when the count ends."};
+inline constexpr SendingWords answerAwaitedAdvice{u"לפני השליחה יש לענות על התמונות שאינן בהזמנה.",
+                                                  u"Before the sending, please answer about the pictures left out."};
 inline constexpr SendingWords sendingAdvice{u"ההזמנה נשלחת. נא לא לסגור את התוכנה.",
                                             u"The order is being sent. Please do not close the program."};
 inline constexpr SendingWords checkingAdvice{u"בודקים אילו קבצים הגיעו לשרת. נא להמתין.",
@@ -39,13 +41,15 @@ inline constexpr SendingWords numberTakenWords{
     u"המספר %1 כבר שייך בשרת להזמנה אחרת. ההזמנה תוכן מחדש במספר אחר.",
     u"Number %1 already belongs to another order on the server. Your order is prepared again under another number."};
 inline constexpr SendingWords notKeptWords{
-    u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה. יש לפנות מקום בדיסק או לתקן את ההרשאות.",
-    u"How far the sending has come can't be written on this computer. Free some space or mend the rights."};
+    u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה. השליחה נמשכת. יש לפנות מקום בדיסק או לתקן את ההרשאות של תיקיית "
+    u"הנתונים.",
+    u"How far the sending has come can't be written on this computer. The sending goes on. Free some disk space, or "
+    u"correct the permissions of the data folder."};
 inline constexpr SendingWords byNamesOnlyWords{u"ההגעה הוכחה לפי שמות בלבד: השרת אינו מוסר אורכים.",
                                                u"Arrival is proven by names only: the server tells no lengths."};
 inline constexpr SendingWords reportUnknownWords{
-    u"הדיווח למעבדה התחיל, ולא ידוע אם התקבל.",
-    u"The report to the lab was begun, and it is not known whether it was heard."};
+    u"הדיווח למעבדה התחיל, ולא ידוע אם התקבל. לפני דיווח נוסף יש לשאול במעבדה.",
+    u"The report to the lab was begun; whether the lab has got it is not known. Ask the lab before you report again."};
 inline constexpr SendingWords reportAgainWords{u"דווח שוב", u"Report again"};
 
 inline constexpr SendingWords fewerReportingWords{u"ההזמנה הגיעה. מודיעים לחנות, נא להמתין.",

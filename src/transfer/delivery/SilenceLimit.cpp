@@ -1,5 +1,8 @@
 #include "transfer/delivery/SilenceLimit.h"
 
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -41,6 +44,11 @@ void SilenceLimit::moved(qint64 bytes, const QDateTime& now) {
 
 bool SilenceLimit::over() const {
     return m_state.Careful && (m_silentFiles >= mostSilentFiles || m_tooSlow);
+}
+
+bool SilenceLimit::overAfter(const Platform& platform, qint64 skipped) {
+    moved(platform.internet.bytesMoved() + skipped, platform.clock.now());
+    return over();
 }
 
 } // namespace lumora

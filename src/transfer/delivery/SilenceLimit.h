@@ -6,6 +6,7 @@
 
 namespace lumora {
 
+struct Platform;
 struct SessionState;
 
 // Tells when a sending waits for a server in vain: two files in a row, or reconnects of a check, whose connects all ran
@@ -23,6 +24,8 @@ public:
     // Told about once a second while the pass runs. bytes: a count that only grows, with what a skipped file has.
     void moved(qint64 bytes, const QDateTime& now);
     bool over() const;
+    // moved() with what the line has moved by now, and skipped; then over().
+    bool overAfter(const Platform& platform, qint64 skipped = 0);
 
 private:
     struct Sample {

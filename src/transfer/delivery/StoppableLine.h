@@ -17,7 +17,7 @@ public:
 
 private:
     Internet& m_internet;
-    EventPump* m_before; // of a call on the line inside which this one runs
+    EventPump* m_before; // pump of the outer call, set again at the end
 };
 
 } // namespace lumora

@@ -15,10 +15,13 @@ bool FtpFolderOwner::asks() const {
     return m_state.Careful;
 }
 
-bool FtpFolderOwner::mayHaveMade(const OrderJournal& order) const {
-    const bool older = !order.known() && m_state.transfer.SugMishloah == Sending::Resend;
-    return order.state().makesFolder || order.state().sentBefore || older;
+namespace {
+
+bool mayHaveMade(const OrderJournal& order) {
+    return order.mayHaveMadeFolder(Sender::Ftp) || order.wasSentBefore();
 }
+
+} // namespace
 
 FtpFolderOwner::Owner FtpFolderOwner::of(const OrderJournal& order, FtpConnection& connection,
                                          const FtpListing& listing) const {
@@ -48,6 +51,8 @@ FtpFolderOwner::Owner FtpFolderOwner::of(const OrderJournal& order, FtpConnectio
 FtpFolderOwner::Log FtpFolderOwner::logThere(const OrderJournal& order, FtpConnection& connection) const {
     const DrivePath log = order.folder().logPath();
     const Result<QByteArray> ours = m_files.read(log);
+    if (!ours && ours.failure().kind != Failure::Kind::NotFound)
+        return Log::NotKnown;
     const DrivePath fetched = order.folder().fetchedLogPath();
     const Result<HostPath> target = m_files.host(fetched);
     if (!target)

@@ -14,8 +14,8 @@ class FtpFolderOwner {
 public:
     enum class Owner {
         NotAsked, // as built in
-        Ours,     // made by this order, or with this order's log in it, byte for byte; empty alone where the making may
-                  // have come through unanswered, and where an older version, which kept no state, may have made it
+        Ours,     // made by this order, or holds this order's log byte for byte; an empty one only where the answer to
+                  // its making is not known, or an older version may have made it
         Foreign,
         NotKnown, // the listing could not be read, or the line was cut
     };
@@ -33,7 +33,6 @@ public:
 private:
     enum class Log { Same, Other, None, NotKnown };
     Log logThere(const OrderJournal& order, FtpConnection& connection) const;
-    bool mayHaveMade(const OrderJournal& order) const;
 
     const SessionState& m_state;
     const Files& m_files;

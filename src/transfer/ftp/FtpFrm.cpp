@@ -1,11 +1,13 @@
 #include "transfer/ftp/FtpFrm.h"
 
+#include "order/OrderJournal.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
+#include "transfer/report/InetForm.h"
 
 namespace lumora {
 
@@ -161,7 +163,7 @@ void FtpFrm::sendOrder() {
         return;
     }
     if (*end == SendingPhase::NumberTaken) {
-        prepareAgain();
+        prepareOrderAgain();
         return;
     }
     if (*end == SendingPhase::NotAll)
@@ -192,7 +194,7 @@ void FtpFrm::showFailure() {
     showSecondsAfterFailure();
 }
 
-// A stop that came too late for the sending is none of the telling.
+// A stop pressed at the end of the sending must not cut the report.
 void FtpFrm::tellOfArrival() {
     m_sender.stop.StopFlag = false;
     enter(SendingPhase::Reporting);
@@ -306,6 +308,26 @@ void FtpFrm::FtpEnableControls(bool enable) {
     cmdClosehOpen.visible = enable;
     cmdInternetOpen.visible = txtProxy.visible = Label4Proxy.visible = !enable;
     showLabButtons();
+}
+
+bool FtpFrm::orderMayBeSent() {
+    return SendingPage::mayBeSent(lists().List3.items()) && !m_sender.stop.left;
+}
+
+void FtpFrm::prepareOrderAgain() {
+    const auto isTaken = [this](const QString& name) { return lists().List5.contains(name); };
+    if (SendingPage::prepareAgain(*m_sender.session.journal(), isTaken))
+        return;
+    tellForeign();
+    finish(SendingPhase::CallLab);
+}
+
+void FtpFrm::tellForeign() {
+    failed(LineStep::ForeignFolder, {Failure::Kind::InUse, m_state.transfer.ShemTikiya}, {});
+}
+
+ReportCalls* FtpFrm::reportCalls() {
+    return m_chain.isRegistered(PageId::InetForm) ? &m_chain.load<InetForm>() : nullptr;
 }
 
 } // namespace lumora

@@ -117,13 +117,11 @@ private:
     void tellOfArrival();
     void showFailure();
     void showProof();
-    void FtpEnableControls(bool enable);
-
-    // FtpFrmGuards.cpp
-    bool mayBeSent();    // what List3 names makes an order
-    void prepareAgain(); // the order's number is another order's on the server
+    void watchLine() { m_sender.watch(); } // each second of a sending
+    bool orderMayBeSent();                 // what List3 names makes an order
+    void prepareOrderAgain();              // the order's number is another order's on the server
     void tellForeign();
-    void watchLine(); // each second of a sending
+    void FtpEnableControls(bool enable);
 
     // FtpFrmTexts.cpp
     std::span<const PhaseLook> looks() const override;

@@ -50,7 +50,7 @@ void FtpFrm::refillAndSendInRounds() {
     m_sender.lists.List3.clear();
     m_sender.lists.List3.append(BulkFiles(m_handedOver, inPieces()));
     addProofPicture();
-    if (!mayBeSent()) {
+    if (!orderMayBeSent()) {
         refuseOrder();
         return;
     }
@@ -69,7 +69,7 @@ void FtpFrm::sendInRounds() {
     }
     const std::optional<SendingPhase> end = m_sender.runOlderRounds();
     if (end == SendingPhase::NumberTaken) {
-        prepareAgain();
+        prepareOrderAgain();
         return;
     }
     if (end == SendingPhase::NotAll)
@@ -111,7 +111,7 @@ void FtpFrm::SendChainOrder(const QString& name) {
         m_state.transfer.OrderFolder = folder;
         listFolder();
         countPictures();
-        if (mayBeSent()) {
+        if (orderMayBeSent()) {
             m_sender.beginOrder();
             m_state.transfer.ShemTikiya = name;
             listOnServer();

@@ -54,7 +54,7 @@ void FtpFrm::listFolder() {
         showFileCount(0);
         return;
     }
-    listFiles(order.path(), u"*.gbr;*.jpp;*.prk"_s);
+    listFiles(order.path(), ftpOrderPattern);
     showFileCount(m_files.count());
     ReadOrderDetails(m_platform.files, order.logPath(), m_state.shemot);
     ShowOrderSummary();
@@ -93,8 +93,7 @@ void FtpFrm::addProofPicture() {
 void FtpFrm::countPictures() {
     TextList& names = m_sender.lists.List8;
     names.clear();
-    for (const QString& path : lists().List3.items())
-        names.append(LeafName(path));
+    names.append(LeafNames(lists().List3.items()));
     m_state.shemot.TotalPics = sumOfCopies(names.items(), CopiesIn::FileNames);
     m_printCount = m_state.shemot.TotalPics;
     showCounts();
@@ -120,13 +119,13 @@ void FtpFrm::refuseOrder() {
 void FtpFrm::armCountdown() {
     m_platform.pump.pump();
     countPictures();
-    // The lab may have taken its files away since.
+    // The server is not asked: the lab may have removed the order's files.
     if (!lists().List3.isEmpty() && m_sender.onlyReportIsLeft()) {
         m_sender.beginOrder();
         showEnd(m_sender.report.endWhereLeft());
         return;
     }
-    if (lists().List3.isEmpty() || !mayBeSent()) {
+    if (lists().List3.isEmpty() || !orderMayBeSent()) {
         refuseOrder();
         return;
     }

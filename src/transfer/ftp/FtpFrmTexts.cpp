@@ -104,7 +104,7 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Command15.enabled = Command21.enabled = underWay;
     Command15.visible = row.buttons.testFlag(Stop);
     Image5.visible = row.buttons.testFlag(SendNow);
-    Image5.enabled = Command23.enabled = row.main == SendNow; // before that no order is listed
+    Image5.enabled = Command23.enabled = row.main == SendNow && !isAnswerAwaited(); // before that no order is listed
     if (!underWay && row.phase != SendingPhase::Preparing)
         Picture1.visible = false;
     Pic4Blink.visible = row.sign == SendingSign::Seconds && row.phase != SendingPhase::Waiting;

@@ -169,7 +169,7 @@ void FtpSender::takeBroken() {
     const OrderJournal& journal = *session.journal();
     const QStringList reported = ReadBrokenFiles(m_platform.files, journal.folder());
     QStringList inHand = journal.state().filesInHand;
-    // The list of broken files is written anew by this sending, which may be one of other files.
+    // This sending rewrites the list of broken files, so files of an earlier one are kept in hand.
     for (const QString& path : reported) {
         if (!lists.List3.contains(path))
             session.keep(session.journal()->take(path));
@@ -184,7 +184,7 @@ void FtpSender::takeBroken() {
 
 bool FtpSender::onlyReportIsLeft() const {
     return m_transfer.SugMishloah == Sending::NewOrder &&
-           LabReport::isLeft(OrderJournal(m_platform.files, OrderFolder(m_transfer.OrderFolder)).state());
+           OrderJournal(m_platform.files, OrderFolder(m_transfer.OrderFolder)).state().onlyReportIsLeft();
 }
 
 std::int16_t FtpSender::countList3() const {

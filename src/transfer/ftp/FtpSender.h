@@ -16,8 +16,8 @@ public:
 
     // Removes all that belongs to an earlier order.
     void clearLists();
-    // Takes List3 as the whole order of OrderFolder, and as broken what an earlier sending left so of it: the files of
-    // kashloo.txt and those that were in hand when a program ended.
+    // Takes List3 as the whole order of OrderFolder. Broken are the files of kashloo.txt and those that were in hand
+    // when a program ended.
     void beginOrder();
     // OrderFolder's order is new, and an earlier run found that it arrived: only the lab was not told.
     bool onlyReportIsLeft() const;

@@ -313,13 +313,12 @@ bool FtpSession::EnterOrderFolder() {
 }
 
 bool FtpSession::FtpMakeOrderDir(const QString& name) {
-    // A program that ends before the answer comes finds the folder there, and takes it for its own.
-    if (m_journal)
-        keep(m_journal->folderIsAsked());
+    // After a program that ended before the answer, the next one finds an empty folder and takes it as the order's own.
+    if (hConnection)
+        keep(m_journal->folderIsAsked(Sender::Ftp));
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
-        if (m_journal &&
-            (made.failure().kind == Failure::Kind::Refused || made.failure().kind == Failure::Kind::AccessDenied))
+        if (made.failure().kind == Failure::Kind::Refused || made.failure().kind == Failure::Kind::AccessDenied)
             keep(m_journal->folderIsRefused());
         trouble(LineStep::OrderFolder, made.failure());
         log(u" make remotedir fail"_s);
@@ -536,7 +535,7 @@ void FtpSession::listHereAgain() {
 void FtpSession::putHere(const DrivePath& path) {
     const auto local = m_platform.files.drives().toHost(path);
     const bool ofOrder = m_journal && path.folder() == m_journal->folder().path();
-    // A file that was in hand before stays so: the hand may put it into another folder.
+    // A file that was in hand stays in hand: the operator may put it into another folder.
     const bool takes = ofOrder && !m_journal->state().filesInHand.contains(path.text());
     if (takes)
         keep(m_journal->take(path.text()));

@@ -56,17 +56,13 @@ bool UploadCheck::endEarly() {
     return true;
 }
 
-// By the way of a stop, which ends whatever is under way.
 void UploadCheck::endSilent() {
     m_silent = true;
     m_stop.StopFlag = true;
 }
 
 void UploadCheck::watch() {
-    if (!m_running || m_silent || m_stop.StopFlag)
-        return;
-    m_silence.moved(m_platform.internet.bytesMoved(), m_platform.clock.now());
-    if (!m_silence.over())
+    if (!m_running || m_silent || m_stop.StopFlag || !m_silence.overAfter(m_platform))
         return;
     endSilent();
     m_platform.internet.abort();
@@ -180,7 +176,7 @@ void UploadCheck::prove() {
 
 QStringList UploadCheck::restOfOrder() const {
     const OrderFolder order(m_transfer.OrderFolder);
-    const QStringList entries = m_files.names(order.path(), u"*.gbr;*.jpp;*.prk"_s);
+    const QStringList entries = m_files.names(order.path(), ftpOrderPattern);
     QStringList rest = FtpOrderFiles(m_files, order, entries, TravelsInPieces(order.name()));
     rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
     return rest;
@@ -196,11 +192,9 @@ Arrival UploadCheck::orderThere() {
     const std::optional<ArrivalProof> ofRest = m_session.prove(rest);
     if (!ofRest || !ofRest->proven())
         return Arrival::Part;
-    OrderLog log;
-    if (const Result<QByteArray> bytes = m_files.read(order.logPath()))
-        log.read(*bytes);
+    const std::optional<OrderLog> log = ReadOrderLog(m_files, order);
     const QStringList there = m_lists.List6.items();
-    return arrivalBy(OrderCompleteness::of(log.Hazmana.isEmpty() ? nullptr : &log, there, there).verdict());
+    return arrivalBy(OrderCompleteness::of(log ? &*log : nullptr, there, there).verdict());
 }
 
 Arrival UploadCheck::arrivalByNames() const {
@@ -269,8 +263,7 @@ void UploadCheck::ConfirmBrokenGone() {
     m_session.PauseBar();
     TextList& broken = m_lists.List4Broken;
     m_lists.List4BrokenB.clear();
-    for (const QString& path : broken.items())
-        m_lists.List4BrokenB.append(LeafName(path));
+    m_lists.List4BrokenB.append(LeafNames(broken.items()));
     for (int i = 0; i < m_lists.List4BrokenB.count() && !broken.isEmpty(); ++i) {
         const QString name = m_lists.List4BrokenB.item(i);
         int last = -1;

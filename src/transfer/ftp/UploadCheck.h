@@ -9,8 +9,8 @@
 namespace lumora {
 
 // The check after each pass: it reconnects, deletes the remains of failed puts from the server and counts the names in
-// the order's folder. An order counts as sent when that folder holds as many names as the order has files; sizes and
-// dates are not compared.
+// the order's folder. As built in an order counts as sent when that folder holds as many names as the order has files;
+// Careful, FtpArrival proves names and lengths.
 class UploadCheck {
 public:
     UploadCheck(const SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
@@ -40,7 +40,7 @@ public:
     void ConfirmBrokenGone();
     void RebuildMissing();
 
-    // Removes from List3 what List6 names.
+    // Removes from List3 what has arrived, by the proof where there is one.
     void DropAlreadySent();
 
     // What the last ListServerFiles proves of the files of the sending; none as built in, and where it has not read the

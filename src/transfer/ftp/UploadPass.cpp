@@ -56,10 +56,7 @@ bool UploadPass::endEarly() {
 }
 
 void UploadPass::watch() {
-    if (!m_running || m_end || m_stop.StopFlag)
-        return;
-    m_silence.moved(m_platform.internet.bytesMoved() + m_skipped, m_platform.clock.now());
-    if (!m_silence.over())
+    if (!m_running || m_end || m_stop.StopFlag || !m_silence.overAfter(m_platform, m_skipped))
         return;
     endSilent();
     m_platform.internet.abort();
@@ -110,7 +107,7 @@ void UploadPass::UploadOneFile(int index) {
     if (!stands && !reachOrderFolder())
         return;
     const bool good = m_session.inOrderFolder() && send(m_lists.List3.item(index));
-    // A server that ends each session behind its first put would cost every second file.
+    // With a server that ends each session after its first put, every second file would fail.
     if (!good && m_putsOfSession == 1)
         m_keeps = false;
     if (!m_keeps || !good || m_stop.StopFlag || index == m_lists.List3.lastIndex())

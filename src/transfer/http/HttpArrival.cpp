@@ -48,16 +48,9 @@ bool HttpArrival::byNameOnly() const {
     return m_byName || !m_state.Careful;
 }
 
-// A server that changes the letter case has the file under the name of its list.
 HttpArrival::Asked HttpArrival::ask(const QString& name, const Listed& there) {
-    QStringList names{name};
-    for (const QString& entry : there.entries) {
-        const QString listed = entry.trimmed();
-        if (listed != name && listed.compare(name, Qt::CaseInsensitive) == 0)
-            names += listed;
-    }
     bool gone = true;
-    for (const QString& each : names) {
+    for (const QString& each : NamesAsListed(name, there.entries)) {
         m_silence.begin();
         const Result<std::optional<qint64>> told =
             m_platform.internet.contentLength(there.uploads + NameInAddress(each));
@@ -69,18 +62,29 @@ HttpArrival::Asked HttpArrival::ask(const QString& name, const Listed& there) {
             return {.length = *told};
         gone = gone && missing;
     }
-    return {.gone = gone && knowsHead(there)};
+    if (!gone)
+        return {};
+    const std::optional<bool> knows = knowsHead(there);
+    return knows ? Asked{.gone = *knows} : Asked{.cut = true};
 }
 
 // Some servers answer each HEAD with 404, also for the list that has just been read.
-bool HttpArrival::knowsHead(const Listed& there) {
-    for (int number = 0; !m_knowsHead.value_or(false) && !ListFileName(number).isEmpty(); ++number) {
+std::optional<bool> HttpArrival::knowsHead(const Listed& there) {
+    for (int number = 0; !m_knowsHead && !ListFileName(number).isEmpty(); ++number) {
+        if (m_stop.left || m_stop.StopFlag)
+            return std::nullopt;
+        m_silence.begin();
         const Result<std::optional<qint64>> told =
             m_platform.internet.contentLength(there.uploads + ListFileName(number));
         m_platform.pump.pump();
-        m_knowsHead = told || told.failure().kind != Failure::Kind::NotFound;
+        if (told)
+            m_knowsHead = true;
+        else if (told.failure().kind != Failure::Kind::NotFound)
+            return std::nullopt;
     }
-    return *m_knowsHead;
+    if (!m_knowsHead)
+        m_knowsHead = false;
+    return m_knowsHead;
 }
 
 QStringList HttpArrival::remains(const QStringList& paths, const Listed& there) {

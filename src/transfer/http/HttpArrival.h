@@ -42,8 +42,8 @@ public:
     };
     // Of the files that the list names, those that were left behind and that HEAD does not prove.
     QStringList remains(const QStringList& paths, const Listed& there);
-    // Of the files that the list names, those that are shorter or longer there or whose asking was cut. A file that is
-    // proven is not asked for again.
+    // Of the files that the list names, those that are shorter or longer there, that HEAD does not find, or whose
+    // asking was cut. A file that is proven is not asked for again.
     QStringList unproven(const QStringList& paths, const Listed& there);
 
     // The prints that the order's log names and those of these names, where names are fewer; as built in, never.
@@ -54,7 +54,7 @@ public:
 private:
     struct Asked;
     Asked ask(const QString& name, const Listed& there);
-    bool knowsHead(const Listed& there);
+    std::optional<bool> knowsHead(const Listed& there); // no value where the asking was cut
 
     const SessionState& m_state;
     const Platform& m_platform;

@@ -16,7 +16,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int notAllowed = 401; // of a web server's answer
+// Statuses of a web server's answer.
+constexpr int unauthorized = 401;
 constexpr int forbidden = 403;
 
 bool isSame(const QString& name, const QString& other) {
@@ -42,7 +43,7 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
     if (!answer.files)
         return Owner::NotKnown;
     // This order has posted its log and nothing else.
-    const bool posted = order.state().makesFolder;
+    const bool posted = order.mayHaveMadeFolder(Sender::Http);
     if (answer.files->isEmpty())
         return Owner::Unclaimed;
     if (posted && std::any_of(answer.files->begin(), answer.files->end(), isPrintOrSheet))
@@ -77,19 +78,14 @@ HttpFolderOwner::Log HttpFolderOwner::logThere(const OrderJournal& order, const 
     const DrivePath path = order.folder().logPath();
     const Result<QByteArray> ours = m_platform.files.read(path);
     if (!ours)
-        return Log::Other;
-    QStringList names{path.leaf()};
-    for (const QString& entry : entries) {
-        if (entry.trimmed() != names.first() && isSame(entry.trimmed(), names.first()))
-            names += entry.trimmed();
-    }
-    for (const QString& name : names) {
+        return ours.failure().kind == Failure::Kind::NotFound ? Log::Other : Log::NotKnown;
+    for (const QString& name : NamesAsListed(path.leaf(), entries)) {
         const Result<WebAnswer> theirs = m_platform.internet.fetch(uploads + NameInAddress(name));
         if (!theirs)
             return Log::NotKnown;
         if (theirs->good())
             return theirs->body == *ours ? Log::Same : ours->startsWith(theirs->body) ? Log::Part : Log::Other;
-        if (theirs->status == notAllowed || theirs->status == forbidden)
+        if (theirs->status == unauthorized || theirs->status == forbidden)
             return Log::Withheld;
     }
     return Log::NotKnown;

@@ -128,16 +128,12 @@ void HttpSender::leave() {
 }
 
 void HttpSender::watch() {
-    if (!m_onLine || stopped())
-        return;
-    m_silence.moved(m_platform.internet.bytesMoved(), m_platform.clock.now());
-    if (!m_silence.over())
+    if (!m_onLine || stopped() || !m_silence.overAfter(m_platform))
         return;
     endSilent();
     m_platform.internet.abort();
 }
 
-// By the way of a stop, which ends whatever is under way.
 void HttpSender::endSilent() {
     m_silent = true;
     stop.StopFlag = true;
@@ -184,6 +180,7 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
         files.removeAll(logPath());
     m_silence.begin();
     m_left = static_cast<int>(files.size());
+    m_sent = lists.List4Kvazim.count() - m_left;
     for (int i = 0; i < files.size(); ++i) {
         m_events.sending(i, static_cast<int>(files.size()), LeafName(files[i]));
         HttpPause();
@@ -203,7 +200,7 @@ std::optional<SendingPhase> HttpSender::sendMissing(int) {
 }
 
 bool HttpSender::isEntered() const {
-    return !m_folderOwner.claims() || (m_journal && m_journal->state().folderMadeByUs);
+    return !m_folderOwner.claims() || (m_journal && m_journal->ownsFolder(Sender::Http));
 }
 
 QString HttpSender::logPath() const {
@@ -223,9 +220,10 @@ void HttpSender::claimFolder() {
         HttpPause();
         if (stopped())
             return;
-        keep(m_journal->folderIsAsked());
+        keep(m_journal->folderIsAsked(Sender::Http));
         m_silence.begin();
         m_left = lists.List4Hossarim.count();
+        m_sent = lists.List4Kvazim.count() - m_left;
         m_allPosted = true;
         post(log);
         const bool before = std::exchange(timedOut, m_script.failed() && isTimeOut(m_script.lastFailure()));
@@ -264,8 +262,9 @@ void HttpSender::post(const QString& path) {
     m_events.reached(SendingMoment::Answered);
     if (!m_script.failed()) {
         m_events.reached(SendingMoment::Posted, --m_left);
+        m_sent += unconfirmed ? 0 : 1;
         if (m_journal)
-            m_journal->countFiles(lists.List4Kvazim.count() - m_left, lists.List4Kvazim.count());
+            m_journal->countFiles(m_sent, lists.List4Kvazim.count());
         return;
     }
     m_allPosted = false;
@@ -274,8 +273,8 @@ void HttpSender::post(const QString& path) {
 }
 
 std::optional<SendingPhase> HttpSender::checkArrival(int) {
-    const bool posted = m_owner == Owner::Ours;
-    if (posted) {
+    const bool ours = m_owner == Owner::Ours;
+    if (ours) {
         m_silence.begin();
         compare(m_listNumber);
         if (m_listGuard.asksAgain(m_verdict) && !stopped())
@@ -283,12 +282,12 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
         m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
     }
     // The other order may have come later.
-    if (posted && m_verdict == ServerVerdict::Listed && !stopped() && isClaimedByAnother()) {
-        keep(m_journal->folderIsLost());
-        m_events.failed(LineStep::ForeignFolder, {Failure::Kind::InUse, folderName()});
+    if (ours && m_verdict == ServerVerdict::Listed && !stopped() && isClaimedByAnother()) {
+        keep(m_journal->folderIsLost(Sender::Http));
+        m_events.failed(LineStep::FolderLost, {Failure::Kind::InUse, folderName()});
         return SendingPhase::CallLab;
     }
-    const bool all = posted && lists.List4Hossarim.isEmpty();
+    const bool all = ours && lists.List4Hossarim.isEmpty();
     const std::optional<SendingPhase> early = all ? std::nullopt : endEarly();
     // A failed post explains more than the list that lacks the file.
     if (m_allPosted && !all && !early && !stopped())
@@ -452,7 +451,7 @@ std::optional<bool> HttpSender::hasFolder(const QString& name) {
 }
 
 bool HttpSender::onlyReportIsLeft() const {
-    return m_state.transfer.SugMishloah == Sending::NewOrder && m_journal && LabReport::isLeft(m_journal->state());
+    return m_state.transfer.SugMishloah == Sending::NewOrder && m_journal && m_journal->state().onlyReportIsLeft();
 }
 
 void HttpSender::keepArrival(SendingPhase end) {
@@ -460,10 +459,11 @@ void HttpSender::keepArrival(SendingPhase end) {
 }
 
 bool HttpSender::keepFoundThere() {
-    keepArrival(SendingPhase::Success);
-    const bool due = !lacking() && report.isDueWhereFound();
+    const bool fewer = lacking().has_value();
+    report.keepArrival(fewer ? Arrival::Agreed : Arrival::Whole, SendingPhase::Success, m_arrival.byNameOnly());
+    const bool due = !fewer && report.isDueWhereFound();
     if (!due)
-        keepArrival(SendingPhase::AllThere);
+        report.endUntold();
     return due;
 }
 

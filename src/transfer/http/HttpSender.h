@@ -145,6 +145,7 @@ private:
     int m_listNumber = HttpListGuard::first;
     ServerVerdict m_verdict = ServerVerdict::NotVerified; // of the last check
     int m_left = 0;                                       // files of the pass not yet posted
+    int m_sent = 0;                                       // files of the order answered well or found there
     bool m_allPosted = true;                              // every file of the last pass was posted
     QString m_folderAnswer; // the last one that may tell whose the folder is; none where the server answered badly
     Failure m_listFailure;  // failure of the last list file's download; no message after success

@@ -100,6 +100,16 @@ QString SecondListName() {
     return u"filelist1.txt"_s;
 }
 
+QStringList NamesAsListed(const QString& name, const QStringList& entries) {
+    QStringList names{name};
+    for (const QString& entry : entries) {
+        const QString listed = entry.trimmed();
+        if (listed != name && listed.compare(name, Qt::CaseInsensitive) == 0)
+            names += listed;
+    }
+    return names;
+}
+
 QString NameInAddress(const QString& name) {
     QString encoded = name;
     return encoded.replace(u"%"_s, u"%25"_s).replace(u"#"_s, u"%23"_s).replace(u"?"_s, u"%3F"_s);

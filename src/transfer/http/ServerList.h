@@ -47,6 +47,10 @@ QString ListFileName(int number);
 // The second list file, which is kept beside the orders.
 QString SecondListName();
 
+// The name, then the entries that differ from it in letter case alone: a server that changes the case may know the file
+// under the name of its list only.
+QStringList NamesAsListed(const QString& name, const QStringList& entries);
+
 // A leaf name as it stands in an address: "%", "#" and "?" would end its path or begin an escape.
 QString NameInAddress(const QString& name);
 

@@ -74,7 +74,7 @@ void UploadForm::refreshList() {
     Picture6.visible = false;
     m_sender.BuildOrderFileList();
     m_sender.stop.StopFlag = false;
-    // The lab may have taken its files away since.
+    // The server is not asked: the lab may have removed the order's files.
     if (m_sender.onlyReportIsLeft()) {
         if (m_sender.report.endWhereLeft() == SendingPhase::Success)
             succeed();
@@ -216,7 +216,7 @@ void UploadForm::sendMissing() {
         endAllThere();
         return;
     case SendingPhase::NumberTaken:
-        prepareAgain();
+        prepareOrderAgain();
         return;
     default:
         endIncomplete(*end);
@@ -230,7 +230,7 @@ void UploadForm::endIncomplete(SendingPhase end) {
     enter(end);
 }
 
-void UploadForm::prepareAgain() {
+void UploadForm::prepareOrderAgain() {
     const auto isTaken = [this](const QString& name) { return m_sender.hasFolder(name); };
     if (SendingPage::prepareAgain(*m_sender.journal(), isTaken) || m_sender.stop.left)
         return;
@@ -253,7 +253,7 @@ void UploadForm::endAllThere() {
     enter(SendingPhase::AllThere);
 }
 
-// A stop that came too late for the sending is none of the telling. False where the customer has left.
+// A stop pressed at the end of the sending must not cut the report. False where the customer has left.
 bool UploadForm::tellOfArrival() {
     m_sender.stop.StopFlag = false;
     percent = 100;

@@ -74,7 +74,7 @@ private:
     void succeed();
     void endAllThere();
     void endIncomplete(SendingPhase end);
-    void prepareAgain();
+    void prepareOrderAgain();
     void leaveForAnother();
 
     // UploadFormTexts.cpp
@@ -113,7 +113,7 @@ private:
     Ticker Timer2;     // 1000 ms: the countdown
     Ticker Timer4Line; // 1000 ms: the watch over the line
     HttpSender m_sender;
-    bool m_busy = false;          // a check outside an attempt runs
+    bool m_busy = false;          // a check or a test of the lab's area uses the line
     bool m_attemptFailed = false; // an attempt of this sending has left files behind
     std::optional<int> m_left;    // files that have not arrived, once they are counted
     QString m_orderName;          // as the server was asked for it

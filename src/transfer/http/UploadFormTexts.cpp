@@ -17,14 +17,13 @@ constexpr SendingWords partWentUp{u"מה שבהזמנה עלה", u"What is in th
 constexpr SendingWords startsIn{u" המשלוח יחל בעוד ", u"The sending starts in"};
 constexpr SendingWords secondsWord{u"שניות", u"seconds"};
 constexpr SendingWords stoppedTitle{u"המשלוח נעצר", u"The sending is stopped"};
-// %1: prints among the files, %2: prints that the log names.
 constexpr SendingWords threeAttempts{u"לאחר שלוש נסיונות המחשב לא הצליח להעלות את כל ההזמנה",
                                      u"After three attempts the computer could not upload the whole order"};
 constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלוח ", u"Files left to send "};
 
 } // namespace
 
-// The page never enters Unclear.
+// The page never enters Unclear, and NumberTaken leads to another page.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
     static constexpr std::array rows{
@@ -94,6 +93,7 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Command3.visible = row.buttons.testFlag(Hold);
     Command15.visible = Command15.enabled = row.buttons.testFlag(Stop);
     Command10.visible = row.buttons.testFlag(GoOn);
+    Command10.enabled = !isAnswerAwaited();
     endClose.visible = row.buttons.testFlag(Close);
     Label11.visible = row.phase == SendingPhase::AllThere && !m_lacking;
     if (!isUnderWay(row.phase) && row.phase != SendingPhase::Preparing)

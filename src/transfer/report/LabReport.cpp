@@ -33,7 +33,12 @@ void LabReport::keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly) 
     if (arrival == Arrival::Part)
         return;
     m_keep(arrival == Arrival::Agreed ? m_order->arrivedAsAgreed() : m_order->arrived(byNameOnly));
-    if (end != SendingPhase::AllThere)
+    if (end == SendingPhase::AllThere)
+        endUntold();
+}
+
+void LabReport::endUntold() {
+    if (!m_order)
         return;
     ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
     reports.endsUntold();
@@ -50,10 +55,6 @@ bool LabReport::isAsAgreed() const {
 
 bool LabReport::isDueAsAgreed() const {
     return isAsAgreed() && isDueWhereFound();
-}
-
-bool LabReport::isLeft(const OrderState& order) {
-    return (order.phase == Phase::Arrived || order.fewerAgreed) && order.report == Report::NotYet;
 }
 
 SendingPhase LabReport::endWhereLeft() const {
@@ -83,7 +84,6 @@ void LabReport::run(const std::function<void(ReportOnce&)>& telling) {
     m_stop.StopFlag = false;
 }
 
-// By the way of a stop.
 void LabReport::watch() {
     if (!m_seconds || ++*m_seconds < longestTelling)
         return;
@@ -95,7 +95,7 @@ bool LabReport::mayTellAgain() const {
     if (!m_order)
         return false;
     const OrderState& order = m_order->state();
-    return order.report != Report::NotYet || order.phase == OrderState::Phase::Arrived || order.fewerAgreed;
+    return order.report != Report::NotYet || order.onlyReportIsLeft();
 }
 
 bool LabReport::wasTold() const {

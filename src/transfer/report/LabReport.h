@@ -34,16 +34,16 @@ public:
     // order: the state of the order that is sent from now on, none where there is none to tell of.
     void beginOrder(OrderJournal* order) { m_order = order; }
 
-    // The sending ends so, and so much has arrived.
+    // Keeps what has arrived at the end of a sending; nothing at an end that is no arrival.
     void keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly);
+    // The order has arrived and ends untold.
+    void endUntold();
     // For an order that lay whole on the server before anything was sent, after keepArrival(): true where the lab has
     // yet to be told of it.
     bool isDueWhereFound() const;
     // The order has arrived with the fewer pictures that the customer has agreed to; due: the lab has yet to be told.
     bool isAsAgreed() const;
     bool isDueAsAgreed() const;
-    // The order has arrived, and only the lab was not told of it yet.
-    static bool isLeft(const OrderState& order);
     // The end of a sending that only tells the lab.
     SendingPhase endWhereLeft() const;
 
@@ -53,7 +53,7 @@ public:
     // Each second of a telling: cuts one that takes too long.
     void watch();
 
-    // A telling was begun, now or earlier.
+    // The order has arrived, or a telling was begun.
     bool mayTellAgain() const;
     // The lab was told to the end.
     bool wasTold() const;

@@ -17,10 +17,6 @@ bool ReportOnce::isWanted(Sender by) const {
     return sending == Sending::NewOrder || (m_state.Careful && sending == Sending::Resend);
 }
 
-bool ReportOnce::hasArrived() const {
-    return m_journal.state().phase >= Phase::Arrived || m_journal.state().fewerAgreed;
-}
-
 bool ReportOnce::keep(const Result<void>& written) {
     if (m_kept)
         m_kept = written;
@@ -35,7 +31,7 @@ std::optional<ReportOnce::Told> ReportOnce::toldOrUnwanted() const {
         return Told::Before;
     if (order.report == Report::Begun)
         return Told::NotKnown;
-    if (!hasArrived() || m_state.transfer.SugMishloah == Sending::Chain)
+    if (!order.hasArrived() || m_state.transfer.SugMishloah == Sending::Chain)
         return Told::NotWanted;
     return std::nullopt;
 }
@@ -46,7 +42,7 @@ ReportOnce::Told ReportOnce::tell(Sender by, ReportCalls& calls) {
         return *before;
     if (isWanted(by))
         return request(calls);
-    if (hasArrived())
+    if (m_journal.state().hasArrived())
         keep(m_journal.needsNoReport());
     return Told::NotWanted;
 }
@@ -69,7 +65,7 @@ ReportOnce::Told ReportOnce::tellAgain(ReportCalls& calls) {
 ReportOnce::Told ReportOnce::request(ReportCalls& calls) {
     if (isStopped())
         return Told::Cut;
-    const bool ofAnArrival = hasArrived() || m_journal.state().report != Report::NotYet;
+    const bool ofAnArrival = m_journal.state().hasArrived() || m_journal.state().report != Report::NotYet;
     if (ofAnArrival && !keep(m_journal.reportBegun()) && m_state.Careful)
         return Told::NotKept;
     if (!makeCalls(calls))

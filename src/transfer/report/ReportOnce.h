@@ -61,7 +61,6 @@ public:
 private:
     std::optional<Told> toldOrUnwanted() const;
     bool isWanted(Sender by) const;
-    bool hasArrived() const; // whole, or with the fewer pictures that the customer has agreed to
     bool isStopped() const;
     Told request(ReportCalls& calls);
     bool makeCalls(ReportCalls& calls) const;
