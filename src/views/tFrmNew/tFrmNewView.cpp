@@ -215,7 +215,8 @@ void tFrmNewView::makeBars() {
     m_undo->setMouseTracking(true);
     m_hintLines.emplace_back(nullptr, &c.Image2[5]);
     frame().addSecondaryAction(m_undo);
-    frame().addHeaderAction(button(c.Image29, Role::Quiet, &tFrmNew::Image29_Click, u"info"_s));
+    m_help = button(c.Image29, Role::Quiet, &tFrmNew::Image29_Click, u"info"_s);
+    frame().addHeaderAction(m_help);
     m_name = oneLine("muted");
     bindName(m_name, c.Title);
     frame().addStatus(m_name);
@@ -278,6 +279,7 @@ void tFrmNewView::render() {
     m_nearTools->setVisible(uncovered && c.Picture3.visible);
     m_farTools->setVisible(uncovered && c.Picture3.visible);
     m_strip->setVisible(uncovered);
+    m_help->setVisible(uncovered); // a panel would cover the button that closes the hints
     m_undo->setVisible(c.Picture3.visible);
     m_name->setText(fromLeft(m_name->fontMetrics().elidedText(c.Title.text, Qt::ElideMiddle, theme().px(260))));
     m_operator->setVisible(state().DegelEdit);

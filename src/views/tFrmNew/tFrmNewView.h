@@ -92,6 +92,7 @@ private:
     std::vector<std::pair<QLabel*, const Caption*>> m_hintLines;
     Overlay* m_hints = nullptr;
     QPushButton* m_operator = nullptr;
+    QPushButton* m_help = nullptr;
     QPushButton* m_undo = nullptr;
     QPushButton* m_done = nullptr;
     int m_covered = 0;
