@@ -1,8 +1,11 @@
 #include "app/Program.h"
+#include "drive/RandomWalk.h"
 #include "drive/ScenarioPlayer.h"
 #include "views/window/Application.h"
 
 #include <QCommandLineParser>
+#include <QDesktopServices>
+#include <QUrl>
 
 #include <cstdio>
 #include <cstdlib>
@@ -32,6 +35,46 @@ QSize sizeIn(const QString& text) {
                                                                                                         : QSize();
 }
 
+int startFailure(const Result<void>& started) {
+    return complain(started.failure().message,
+                    started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
+}
+
+// Takes what a page would open outside the program.
+class NothingOpens : public QObject {
+    Q_OBJECT
+public:
+    NothingOpens() {
+        for (const QString& scheme : schemes)
+            QDesktopServices::setUrlHandler(scheme, this, "take");
+    }
+    ~NothingOpens() override {
+        for (const QString& scheme : schemes)
+            QDesktopServices::unsetUrlHandler(scheme);
+    }
+
+public Q_SLOTS:
+    void take(const QUrl&) {}
+
+private:
+    const QStringList schemes{u"http"_s, u"https"_s, u"file"_s, u"mailto"_s};
+};
+
+// The walk goes on where the customer has ended the program and starts it again.
+int walk(RandomWalk& walk, const ProgramOptions& options) {
+    const NothingOpens nothingOpens;
+    while (!walk.isOver()) {
+        Program program(options);
+        if (const Result<void> started = program.start(); !started)
+            return startFailure(started);
+        QObject::connect(
+            &walk, &RandomWalk::over, qApp, [] { QCoreApplication::exit(); }, Qt::QueuedConnection);
+        walk.walk(program);
+        QApplication::exec();
+    }
+    return walk.failure().isEmpty() ? EXIT_SUCCESS : complain(walk.failure(), aLineFailed);
+}
+
 int play(int argc, char** argv) {
     qputenv("QT_QPA_PLATFORM", "offscreen");
     Application application(argc, argv);
@@ -47,10 +90,15 @@ int play(int argc, char** argv) {
         u"has the data folder."_s);
     parser.addHelpOption();
     parser.addVersionOption();
-    parser.addOptions({{u"lab"_s, u"The deployment file of the lab."_s, u"FILE"_s},
-                       {u"size"_s, u"The window, from 640x480 on."_s, u"WxH"_s, u"1280x1024"_s},
-                       {u"shots"_s, u"Where the pictures of shot go."_s, u"DIR"_s, u"."_s}});
-    parser.addPositionalArgument(u"SCENARIO..."_s, u"The files, played one after the other."_s);
+    parser.addOptions(
+        {{u"lab"_s, u"The deployment file of the lab."_s, u"FILE"_s},
+         {u"size"_s, u"The window, from 640x480 on."_s, u"WxH"_s, u"1280x1024"_s},
+         {u"shots"_s, u"Where the pictures of shot go."_s, u"DIR"_s, u"."_s},
+         {u"walk"_s, u"In place of scenarios: presses what can be pressed, as this number draws it."_s, u"SEED"_s},
+         {u"presses"_s, u"Of a walk, before it brings the order to its end."_s, u"NUMBER"_s, u"300"_s},
+         {u"record"_s, u"Of a walk: an existing folder for what the pages showed."_s, u"DIR"_s, u"."_s}});
+    parser.addPositionalArgument(u"SCENARIO..."_s,
+                                 u"The files, played one after the other; of a walk the folders of pictures."_s);
     if (!parser.parse(QCoreApplication::arguments()))
         return complain(parser.errorText(), notPlayed);
     if (parser.isSet(u"help"_s))
@@ -67,6 +115,11 @@ int play(int argc, char** argv) {
 
     if (parser.positionalArguments().isEmpty())
         return complain(u"No scenario is named; --help tells more."_s, notPlayed);
+    if (parser.isSet(u"walk"_s)) {
+        RandomWalk seeded({parser.value(u"walk"_s).toUInt(), parser.value(u"presses"_s).toInt(),
+                           parser.positionalArguments(), parser.value(u"record"_s)});
+        return walk(seeded, options);
+    }
     std::vector<ScenarioFile> files;
     for (const QString& path : parser.positionalArguments()) {
         Result<ScenarioFile> file = ScenarioFile::load(path);
@@ -77,8 +130,7 @@ int play(int argc, char** argv) {
 
     Program program(options);
     if (const Result<void> started = program.start(); !started)
-        return complain(started.failure().message,
-                        started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
+        return startFailure(started);
     ScenarioPlayer player(program, std::move(files), parser.value(u"shots"_s));
     // quit() would close the window, which may ask the customer.
     QObject::connect(&player, &ScenarioPlayer::finished, &application, [] { QCoreApplication::exit(); });
@@ -93,3 +145,5 @@ int play(int argc, char** argv) {
 int main(int argc, char** argv) {
     return play(argc, argv);
 }
+
+#include "main.moc"
