@@ -132,15 +132,24 @@ class Pair(Case):
 
 # --- the ways in which two come together
 
-def one_workspace(case):
-    """The second program starts while the first one sends."""
-    there, go_on = case.hold(case.put(), 2)
-    case.begin(case.mine)
-    there.wait(100)
-    case.share()
-    second = case.send(case.other)
-    go_on.set()
-    case.judge(case.mine.end(), second, ('arrived whole', 'refused'))
+def at_file(file, join, *wanted):
+    """The second program comes when the first one sends this file; at its first file the folder is empty by FTP, not made by HTTP."""
+    def play(case):
+        there, go_on = case.hold(case.put(), file)
+        case.begin(case.mine)
+        there.wait(100)
+        join(case)
+        second = case.send(case.other)
+        go_on.set()
+        case.judge(case.mine.end(), second, *wanted)
+    return play
+
+
+def one_mark(case):
+    case.make_other(mark=True)
+
+
+one_workspace = at_file(2, Pair.share, ('arrived whole', 'refused'))
 
 
 def one_workspace_at_once(case):
@@ -155,31 +164,8 @@ def one_workspace_at_once(case):
 def one_serial(case):
     """Two data folders with one mark, one order after the other."""
     first = case.send(case.mine)
-    case.make_other(mark=True)
+    one_mark(case)
     case.judge(first, case.send(case.other))
-
-
-def one_serial_in_the_middle(case):
-    """The second order comes while the first one is being sent."""
-    there, go_on = case.hold(case.put(), 3)
-    case.begin(case.mine)
-    there.wait(100)
-    case.make_other(mark=True)
-    second = case.send(case.other)
-    go_on.set()
-    case.judge(case.mine.end(), second)
-
-
-def one_serial_empty_folder(case):
-    """The first order has made its folder, and nothing lies in it when the second one comes. By HTTP the first file makes it: both
-    find none."""
-    there, go_on = case.hold(case.put(), 1)
-    case.begin(case.mine)
-    there.wait(100)
-    case.make_other(mark=True)
-    second = case.send(case.other)
-    go_on.set()
-    case.judge(case.mine.end(), second)
 
 
 def one_serial_both_ask(case):
@@ -220,8 +206,8 @@ PAIRS = [
     ('a second program in one workspace', one_workspace, (('plain', 'ftp'), ('edited', 'http'))),
     ('two programs in one workspace start at once', one_workspace_at_once, (('plain', 'ftp'),)),
     ('one serial, one order after the other', one_serial, (('plain', 'ftp'), ('edited', 'ftp'), ('edited', 'http'))),
-    ('one serial, in the middle of the first order', one_serial_in_the_middle, (('plain', 'ftp'), ('edited', 'http'))),
-    ('one serial, the first folder still empty', one_serial_empty_folder, (('plain', 'ftp'), ('edited', 'http'))),
+    ('one serial, in the middle of the first order', at_file(3, one_mark), (('plain', 'ftp'), ('edited', 'http'))),
+    ('one serial, the first folder still empty', at_file(1, one_mark), (('plain', 'ftp'), ('edited', 'http'))),
     ('one serial, both ask before either has sent', one_serial_both_ask, (('edited', 'http'),)),
     ('a cloned data folder, other network cards', cloned, (('plain', 'ftp'), ('edited', 'http'))),
 ]
