@@ -128,6 +128,7 @@ class Case:
         self.order_of = 'plain' if way == 'ftp' else 'edited'   # the scenario
         self.count = PICTURES
         self.kept = tools.kept    # the FTP session
+        self.switches = ''    # more of the lab's file
 
     # --- the two ends
 
@@ -136,7 +137,8 @@ class Case:
         for name in ('uploads', 'account/' + ACCOUNT):
             (self.folder / name).mkdir(parents=True, mode=0o700)
         self.mine.make(self.pictures)
-        acts = {word: Act(*spec) for word, spec in self.fault.acts.items()}
+        acts = self.acts = {word: Act(*(part[self.kept] if isinstance(part, tuple) else part for part in spec))
+                            for word, spec in self.fault.acts.items()}
         self.web = WebLab(self.folder / 'uploads', acts if self.way == 'http' else {}, self)
         if self.way == 'ftp':
             account = self.folder / 'account'
@@ -210,6 +212,7 @@ class Case:
         host = host or self.host(healed)
         text = LAB.format(host=host if self.ftp else '127.0.0.1:9', upload=host, user=self.ftp.user if self.ftp else 'lab', password=PASSWORD,
                           account=ACCOUNT, web=f'127.0.0.1:{self.web.port}', sender=self.way, data=workspace.data)
+        text = text.replace('[Switches]\n', '[Switches]\n' + self.switches)
         text += '[Guards]\nCareful = yes\n' if self.careful else ''
         if self.server in ('pure-ftpd', 'proftpd') and not self.fault.as_installed:
             text = text.replace('[Addresses]', 'Type = I\n[Addresses]')
@@ -233,6 +236,8 @@ class Case:
             words, status = self.mine.last_words(), self.mine.status
             if 'found page MoogMeret' in words:
                 return 'nothing of it can be chosen'
+            if 'Command4Hemshech is hidden' in words:
+                return 'nothing is offered'
             return status if isinstance(status, str) else f'ENDS EARLY: {status} ' + re.sub(r'.*\.scenario:', '', words)[:90]
         missing = self.missing()
         if self.mine.told() == 'not':
@@ -259,6 +264,11 @@ class Case:
             found.append("another's order overwritten")
         return found + self.wrong_reports(reports)
 
+    def never_came(self):
+        """True where a thing was never done, at none of its commands. As built in the server is asked for no length and no log."""
+        done = {act.do for word, act in self.acts.items() if act.come >= act.first or not self.careful and word in ('SIZE', 'HEAD', 'RETR')}
+        return any(act.do not in done for act in self.acts.values())
+
     def wrong_reports(self, wanted):
         for _ in range(20):    # a request is noted as it is answered
             orders = [path.partition('?')[2] for route, path in self.web.asked if route == 'REPORT' and '?' in path]
@@ -281,6 +291,7 @@ class Case:
         self.tools.playing.add(self)
         try:
             self.play_case()
+            self.found += ['THE FAULT NEVER CAME'] if self.never_came() else []
         finally:
             self.tools.playing.remove(self)
             self.close()
@@ -298,12 +309,19 @@ class Case:
         return self.fault.name == 'no fault' or (self.careful and self.fault.name.endswith(', once'))
 
     def play_case(self):
+        if self.fault.plays:
+            return self.fault.plays(self)
         ended = self.play(self.order_of, self.way)
         self.result = self.verdict(ended)
         told = self.mine.told() if ended else ''
         self.found = self.beside(1 if told == 'arrived' else 0) if ended else []
         if told == 'not' and self.fault.heals:
             self.heal()
-            self.first_proof = self.mine.files().get('000.jpg')
-            self.result += ', by resend ' + self.verdict(self.play('again', self.way, healed=True))
-            self.found = self.beside(1)
+            self.result += ', by resend ' + self.send_again('later', 'again')
+
+    def send_again(self, *scenarios):
+        """What becomes of the order that is sent once more."""
+        self.first_proof = self.mine.files().get('000.jpg')
+        ended = self.play(*scenarios, self.way, healed=True)
+        self.found = self.beside(1 if ended and self.mine.told() == 'arrived' and not self.switches else 0)
+        return self.verdict(ended)

@@ -15,13 +15,14 @@ class Fault:
         self.acts = {word: act if isinstance(act, tuple) else (act,) for word, act in (acts or {}).items()}
         self.host = more.pop('host', 'relay')   # or closed, blackhole, ipv6: what stands in the lab's file
         self.clock = more.pop('clock', 10)      # how many times as fast the program's clock runs
-        self.limit = more.pop('limit', 150)      # seconds here until the program hangs
+        self.limit = more.pop('limit', 150)      # seconds here until the program counts as hanging
         self.only = more.pop('only', ())        # the servers that it is played before; none: all
-        self.again = more.pop('again', 0)       # so many files may be sent though they are there: what the program is told makes it so
+        self.again = more.pop('again', 0)       # files that may be sent twice, since the server's answers call for it
         self.literal = more.pop('literal', '')  # why a lie stays even with Careful
         self.quick = more.pop('quick', False)   # also in ./test
         self.as_installed = more.pop('as_installed', False)  # the server changes files under TYPE A, and the lab has not set I
         self.heals = more.pop('heals', True)    # the server is good when the order is sent again
+        self.plays = more.pop('plays', None)    # what the case plays in place of a sending and a resend
         assert not more, more
 
 
@@ -124,11 +125,6 @@ def foreign_order(session, line):
     session.relay.lab.put_foreign_order()
 
 
-def foreign_order_meanwhile(session, line):
-    session.relay.lab.put_foreign_order()
-    return session.forward(line)
-
-
 def put_stray(session, line):
     session.relay.lab.put_stray()
 
@@ -155,25 +151,42 @@ LISTINGS = {
     'facts as of MLSD': lambda k, s, m, d, t, n: b'type=' + (b'dir' if k == b'd' else b'file;size=' + s) + b'; ' + n,
 }
 
-# The third put is a print; the first listing within the order's folder is the eighth.
+def without_state(case):
+    """The order's hidden state is lost before the order is sent again."""
+    case.result = case.verdict(case.play('plain', 'ftp'))
+    (case.mine.order() / '.order').unlink()
+    del case.relay.acts['STOR']
+    case.result += ', by resend ' + case.send_again('again')
+
+
+def fewer_pictures(case):
+    """The customer agrees to send fewer pictures than the log names, and the lab wants no reports."""
+    case.switches = 'Reports = no\n'
+    case.play('plain', 'prepared')
+    next(case.mine.order().glob('*.jpp')).unlink()
+    case.result = case.send_again('agreed', 'goon')
+    case.result += ', then ' + case.send_again('goon')
+
+
+# The third put is a print. Of a pair the first number is that with a session for each file, the second that with a session kept.
 PRINT = 3
-MIDDLE = 12
+MIDDLE = (12, 6)    # a listing of the order's folder with files in it
 
 FTP = [
     Fault('no fault', quick=True),
     Fault('as installed, under TYPE A', only=('pure-ftpd', 'proftpd'), as_installed=True, heals=False),
     # the way to the server
     Fault('nobody listens', host='closed', only=('scripted',)),
-    Fault('a black hole', host='blackhole', only=('scripted',), clock=60, limit=150),
+    Fault('a black hole', host='blackhole', only=('scripted',), clock=60),
     Fault('IPv6 only', host='ipv6'),
-    Fault('connects and stays silent', {'CONNECT': hang}, clock=120, limit=150, only=('scripted',)),
+    Fault('connects and stays silent', {'CONNECT': hang}, clock=120, only=('scripted',)),
     Fault('connects and stays silent, twice', {'CONNECT': (hang, 2, 3)}, clock=20),
     Fault('two files wait in vain, then not', {'CONNECT': (hang, 10)}, clock=60),
     Fault('too many clients, twice', {'CONNECT': (bye('421 Too many connections'), 2, 2)}, quick=True),
     Fault('too many clients, always', {'CONNECT': bye('421 Too many connections')}),
     Fault('one connection for each address', {'CONNECT': refuse_second}),
     Fault('login refused', {'PASS': reply('530 Login incorrect')}),
-    Fault('login refused, then not', {'PASS': (reply('530 Login incorrect'), 3, 4)}, quick=True),
+    Fault('login refused, then not', {'PASS': (reply('530 Login incorrect'), 3, (4, 2))}, quick=True),
     Fault('wants encryption', {'USER': reply('550 SSL/TLS required on the control channel')}),
     Fault('greeting of several lines', {'GREETING': passed(answer=many_lines)}),
     Fault('replies of several lines', at_each(passed(answer=many_lines), 'GREETING USER PASS PWD TYPE CWD MKD DELE SIZE STOR LIST'),
@@ -187,7 +200,7 @@ FTP = [
     Fault('a folder is made at the second time', {'MKD': (reply('550 Create directory operation failed'), 1)}),
     Fault('the folder cannot be entered, once', {'CWD': (reply('550 Failed to change directory'), 1, 4)}),
     Fault('another order in the folder', {'CONNECT': (foreign_order, 1)}, only=('scripted',), quick=True),
-    Fault('another order comes after the listing', {'MKD': (foreign_order_meanwhile, 1)}, only=('scripted',)),
+    Fault('another order comes after the listing', {'MKD': (foreign_order, 1)}, only=('scripted',)),
     Fault('a stray file in the folder', {'STOR': (put_stray, 1, 2)}, quick=True),
     # the data line
     Fault('no EPSV', no_epsv(), quick=True),
@@ -230,6 +243,8 @@ FTP = [
     Fault('226, the file is half, SIZE refused, bare names',
           {'STOR': (passed(change=half), 1, PRINT), 'SIZE': reply('500 unknown'), 'LIST': lines_as(LISTINGS['bare names'])},
           literal='no length is to be had'),
+    Fault('226, the file is half, SIZE answered 451 three times, bare names',
+          {'STOR': (passed(change=half), 1, PRINT), 'SIZE': (reply('451 Try again'), 3), 'LIST': lines_as(LISTINGS['bare names'])}),
     Fault('SIZE tells other than the listing', {'SIZE': reply('213 5')}),
     Fault('226, the file is gone', {'STOR': (then_gone(), 1, PRINT)}),
     Fault('226, the file is gone, and a stray one there',
@@ -245,6 +260,7 @@ FTP = [
     Fault('listing reset, once', {'LIST': (passed(cut=40), 1, MIDDLE)}),
     Fault('listing refused, once', {'LIST': (reply('425 Failed to establish connection'), 1, MIDDLE)}),
     Fault('listing refused from the middle on', {'LIST': (reply('550 no'), ALWAYS, MIDDLE)}),
+    Fault('listing of the new folder refused, once', {'LIST': (reply('425 Failed to establish connection'), 1, 3)}),
     Fault('listing silent, once', {'LIST': (hang, 1, MIDDLE)}, clock=20),
     Fault('450 for an empty folder', {'LIST': empty_is('450 No files found')}),
     Fault('550 for an empty folder', {'LIST': empty_is('550 No files found')}),
@@ -253,6 +269,9 @@ FTP = [
           {'LIST': passed(change=lambda content: b'drwxr-xr-x 2 lab lab 0 Nov 22 01:02 .\r\ndrwxr-xr-x 2 lab lab 0 Nov 22 01:02 ..\r\n'
                           + content)}),
     *[Fault(f'listing: {name}', {'LIST': lines_as(form)}) for name, form in LISTINGS.items()],
+    Fault('sent again without its state, its log withheld at first', plays=without_state, only=('scripted',), acts={
+        'STOR': (reply('553 Could not create file'), ALWAYS, PRINT), 'RETR': (reply('425 Failed to establish connection'), 1)}),
+    Fault('fewer pictures as agreed, no reports', plays=fewer_pictures, only=('scripted',)),
 ]
 
 
@@ -280,9 +299,13 @@ def silent(session):
     raise OSError
 
 
-def stores_and_drops(session):
-    session.store()
-    drops(session)
+def stored_and_cut(change=None, kills=False):
+    def act(session):
+        session.store(change)
+        if kills:
+            session.server.lab.mine.kill()
+        drops(session)
+    return act
 
 
 def lists(change):
@@ -335,14 +358,21 @@ def stray_file(session):
     session.server.lab.put_stray()
 
 
-def half_and_drop(session):
-    session.store(half)
-    drops(session)
-
-
 def other_length(session):
     path = session.server.root / session.path.partition('/uploads/')[2].replace('%20', ' ')
     return session.answer(b'', length=path.stat().st_size + 7) or True if path.is_file() else False
+
+
+def other_log(case):
+    """Another customer's log takes the place of the order's before the order goes on."""
+    case.play('edited', 'http')
+    log = case.arrived / case.mine.order().name / (case.mine.order().name + '.txt')
+    log.write_bytes(log.read_bytes().replace(b'Dana', b'Noam'))
+    case.foreign = {log: log.read_bytes()}
+    case.heal()
+    case.result = case.send_again('goon')
+    if case.mine.told() == 'not' and 'call the lab' not in case.mine.said:
+        case.found.append('the customer is not to call the lab')
 
 
 # The first list is asked for before anything is sent. Without any list that can be read the next attempt posts all again.
@@ -364,12 +394,12 @@ HTTP = [
     Fault('POST: silence, once', {'POST': (silent, 1, 2)}, clock=20, limit=120),
     Fault('POST: silence, always', {'POST': silent}, clock=60),
     Fault('POST: 0.3 kB/s for ever', {'READ': slowly(20_000)}, clock=60),
-    Fault('POST: half stored, line cut, once', {'POST': (half_and_drop, 1, 2)}),
-    Fault('POST: half stored, line cut, once, and no HEAD', {'POST': (half_and_drop, 1, 2), 'HEAD': says(b'', 405)}),
+    Fault('POST: half stored, line cut, once', {'POST': (stored_and_cut(half), 1, 2)}),
+    Fault('POST: half stored, line cut, once, and no HEAD', {'POST': (stored_and_cut(half), 1, 2), 'HEAD': says(b'', 405)}),
     Fault('POST: an answer shorter than it says, once', {'POST': (lambda session: session.store() or session.answer(b'sto', length=90)
                                                                   or drops(session), 1, 2)}),
     Fault('POST: line cut, once', {'POST': (drops, 1, 2)}, quick=True),
-    Fault('POST: stored, line cut, once', {'POST': (stores_and_drops, 1, 2)}),
+    Fault('POST: stored, line cut, once', {'POST': (stored_and_cut(), 1, 2)}),
     Fault('POST: redirect 302', {'POST': redirects(302)}),
     Fault('POST: redirect 307', {'POST': redirects(307)}),
     Fault('list script: 500, once', {'MAKELIST': (says(b'', 500), 1, FIRST)}),
@@ -394,6 +424,7 @@ HTTP = [
     Fault('list: Content-Length too small', {'FETCH': (of_list(add=-60), 2, 3)}),
     Fault('no HEAD', {'HEAD': says(b'', 405)}),
     Fault('HEAD: 404', {'HEAD': says(b'', 404)}),
+    Fault('HEAD: 503 three times, half of a print stored', {'HEAD': (says(b'', 503), 3), 'POST': (stored(half), 1, 3)}),
     Fault('HEAD: line cut, once', {'HEAD': (drops, 1, 2)}, again=1),
     Fault('HEAD: silence', {'HEAD': silent}, clock=60, again=10),
     Fault('HEAD tells another length, once', {'HEAD': (other_length, 1, 2)}, again=1),
@@ -401,6 +432,7 @@ HTTP = [
     Fault('a stray file in the folder', {'POST': (stray_file, 1, 2)}, quick=True),
     Fault('no HEAD, half of a file stored', {'HEAD': says(b'', 405), 'POST': (stored(half), 1, 2)}, literal='no length is to be had'),
     Fault('another order in the folder', {'MAKELIST': (foreign_folder, 1)}, quick=True),
+    Fault("killed behind the last file, another order's log there", {'POST': (stored_and_cut(kills=True), 1, 5)}, plays=other_log),
     Fault('report: 500', {'REPORT': says(b'', 500), 'DONE': says(b'', 500)}),
     Fault('report: silence', {'REPORT': silent, 'DONE': silent}, clock=60, limit=120),
     Fault('report: line cut', {'REPORT': drops, 'DONE': drops}),

@@ -8,7 +8,7 @@ from faults import Fault
 from relay import Act
 
 MEMORY = 100        # MB that the sending of 1,000 pictures may hold at most
-# How much longer than vsftpd proftpd may take: as a factor where the session is kept, in seconds a file where each file has its own,
+# How much longer proftpd may take than vsftpd: as a factor where the session is kept, in seconds a file where each file has its own,
 # since proftpd takes no connection for 0.2 s, twice, after each session that ends.
 FACTOR = 1.25
 SLOWER = 0.5
@@ -26,9 +26,7 @@ class Load(Case):
     def open(self):
         self.pictures = self.tools.shown(f'shown-{self.number}-{self.server}', self.count, '0.05')
         super().open()
-        prepared = self.folder / 'prepared.scenario'
-        prepared.write_text('page FtpFrm 600\n')
-        self.mine.begin('plain', prepared, lab=self.lab(), hurry=10)
+        self.mine.begin('plain', 'prepared', lab=self.lab(), hurry=10)
         self.mine.end(self.fault.limit)
         if self.mine.status or not self.mine.is_whole_here(pictures=self.count):
             raise RuntimeError('the order was not made: ' + self.mine.last_words())
