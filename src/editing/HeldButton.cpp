@@ -2,19 +2,24 @@
 
 #include "session/Ticker.h"
 
+#include <utility>
+
 namespace lumora {
 
 void HeldButton::press(Ticker& ticker) {
-    release();
+    end(End::Lost);
     m_ticker = &ticker;
     m_ticked = false;
     ticker.start();
 }
 
-void HeldButton::release() {
+bool HeldButton::end(End how) {
+    if (m_ticker != nullptr && !m_ticked && how == End::LetGo)
+        m_ticker->tick();
     if (m_ticker != nullptr)
         m_ticker->stop();
     m_ticker = nullptr;
+    return std::exchange(m_ticked, false);
 }
 
 bool HeldButton::ticks(const Ticker& ticker) {
@@ -22,11 +27,6 @@ bool HeldButton::ticks(const Ticker& ticker) {
         return false;
     m_ticked = true;
     return true;
-}
-
-void HeldButton::tickOnceIfNone() {
-    if (m_ticker != nullptr && !m_ticked)
-        m_ticker->tick();
 }
 
 } // namespace lumora

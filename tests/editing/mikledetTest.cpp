@@ -80,14 +80,12 @@ TEST_F(CaptionKeys, aHeldButtonStepsByTwoForEachTickAndATapIsOneStep) {
         page().Image1_MouseDown();
         for (int i = 0; i < ticks; ++i)
             page().Timer2_Tick();
-        page().tickOnceIfNone();
         page().Image1_MouseUp();
-        page().tickOnceIfNone();
     }
     EXPECT_EQ(kept().TextFontSize, 24 + 4 + 2);
     page().Image2_MouseDown();
     chain.show(PageId::tFrmNew);
-    page().tickOnceIfNone();
+    page().Image2_MouseUp();
     EXPECT_EQ(state.edit.TextFontSize, 30) << "let go when another page comes";
 }
 

@@ -144,6 +144,12 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
         EXPECT_EQ(field(EditRecord::ZoomPercent), QLatin1String(zoom));
     }
     editor.Image2_MouseDown(0);
+    holdImage2(0, 0);
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"106"_s) << "a tap is one step";
+    editor.VScrollZ_Change(150);
+    editor.Image2_MouseDown(0);
+    editor.stopHolds();
+    EXPECT_EQ(field(EditRecord::ZoomPercent), u"106"_s) << "lost before the first step";
     editor.Timer2_Tick();
     UnpackEditState(EditRecord::newPicture(), state.edit);
     state.edit.PicturePath = standing;

@@ -42,7 +42,7 @@ mikledet::mikledet(SessionState& state, const Platform& platform, PageChain& cha
     , m_timer2(sizeMilliseconds, [this] { resizeOnce(); })
     , m_guard(state) {
     connect(&chain, &PageChain::shown, this, [this] {
-        stopHolding();
+        stopHolds();
         refresh(); // another picture may have been opened since
     });
 }
@@ -156,7 +156,7 @@ void mikledet::chooseFont(int index) {
 }
 
 void mikledet::backToEditor() {
-    stopHolding();
+    stopHolds();
     Frame1.visible = false;
     m_chain.follow(pageId, Outcome::EditingDone);
 }
@@ -202,10 +202,9 @@ void mikledet::resizeOnce() {
     commitStep();
 }
 
-void mikledet::endHold() {
-    if (!m_held.isHeld())
+void mikledet::endHold(HeldButton::End how) {
+    if (!m_held.end(how))
         return;
-    m_held.release();
     if (auto* editor = m_chain.find<tFrmNew>())
         editor->keepRecord();
 }

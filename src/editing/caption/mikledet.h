@@ -55,15 +55,13 @@ public:
     void Image1_MouseDown() { holdSize(CaptionStep::step); }
     void Image2_MouseDown() { holdSize(-CaptionStep::step); }
     void Image15_MouseDown(int direction) { holdArrow(direction); } // left, right, up, down
-    void Image1_MouseUp() { stopHolding(); }
-    void Image2_MouseUp() { stopHolding(); }
-    void Image15_MouseUp() { stopHolding(); }
+    void Image1_MouseUp() { endHold(HeldButton::End::LetGo); }
+    void Image2_MouseUp() { endHold(HeldButton::End::LetGo); }
+    void Image15_MouseUp() { endHold(HeldButton::End::LetGo); }
     void Timer1_Tick() { moveOnce(); }
     void Timer2_Tick() { resizeOnce(); }
-    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
-    void tickOnceIfNone() { m_held.tickOnceIfNone(); }
-    // The pointer was lost or the page went.
-    void stopHolding() { endHold(); }
+    // Ends a held button: the pointer was lost, or the page went. A button that has not ticked does nothing.
+    void stopHolds() { endHold(HeldButton::End::Lost); }
 
     void Image3_Click() { change(CaptionStep::nextStyle); }
     void Image4_Click() { change(CaptionStep::turn); }
@@ -106,7 +104,7 @@ private:
     void holdMove(std::int16_t x, std::int16_t y);
     void moveOnce();
     void resizeOnce();
-    void endHold();
+    void endHold(HeldButton::End how);
     void backToEditor();
 
     const SessionState& m_state;

@@ -55,7 +55,7 @@ public:
     void takeCaptionStep(); // the same while a button is held: the record is stored by storedMeanwhile()
     void keepRecord();      // packs and stores
     void takeCorrection();  // the red-eye page has changed the corrected copy or its mark
-    // Ends a held button and a drag as their MouseUp does: the pointer was lost, or the page went.
+    // Ends a held button and a drag: the pointer was lost, or the page went. A button that has not ticked does nothing.
     void stopHolds();
 
     void Command17_Click() { openPicture(); }
@@ -106,8 +106,6 @@ public:
     void Timer6_Tick() { turn(); }
     void Timer7_Tick() { moveAcross(); }
     void Timer8_Tick() { moveDown(); }
-    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
-    void tickOnceIfNone() { m_held.tickOnceIfNone(); }
 
     void Image15_Click() { turnQuarterRight(); }
     void Image18_Click() { turnQuarterLeft(); }
@@ -176,7 +174,6 @@ Q_SIGNALS:
 
 private:
     enum class Held { Closer, Further, Darker, Lighter, Right, Left, Up, Down, TurnRight, TurnLeft };
-    enum class Release { MouseUp, Lost };
     enum class Panel { None, Tones, Turns }; // Frame3, Frame4
 
     // The way out of the page, and looking.
@@ -199,8 +196,8 @@ private:
     void holdTool(int index);
     void beginHold(Held what);
     void dropHold();
-    void endHold(Release release = Release::MouseUp);
-    void zoomReleased(Release release);
+    void endHold(HeldButton::End how = HeldButton::End::LetGo);
+    void zoomReleased(HeldButton::End how);
     void zoom();
     void brighten();
     void turn();

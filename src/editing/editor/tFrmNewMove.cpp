@@ -27,27 +27,27 @@ void tFrmNew::beginHold(Held what) {
 
 // Nothing is stored here, since the fields may be those of another picture by now.
 void tFrmNew::dropHold() {
-    m_held.release();
+    m_held.end(HeldButton::End::Lost);
     sunkImage2 = -1;
     Image3.release();
     m_labelHandle.release();
     m_cropHandle.release();
 }
 
-void tFrmNew::endHold(Release release) {
-    const bool zoomed = m_held.holds(Timer2);
-    const bool brightened = m_held.holds(Timer3);
-    m_held.release();
+void tFrmNew::endHold(HeldButton::End how) {
+    const bool zooms = m_held.holds(Timer2);
+    const bool brightens = m_held.holds(Timer3);
+    const bool ticked = m_held.end(how);
     sunkImage2 = -1;
-    if (zoomed)
-        zoomReleased(release);
-    else if (brightened)
+    if (zooms && ticked)
+        zoomReleased(how);
+    else if (brightens && ticked)
         StoreCurrentEdit();
     Q_EMIT changed();
 }
 
 void tFrmNew::stopHolds() {
-    endHold(Release::Lost);
+    endHold(HeldButton::End::Lost);
     endCaptionDrag();
     endDrag();
     m_cropHandle.release();
@@ -74,9 +74,9 @@ void tFrmNew::zoom() {
     showNumbers();
 }
 
-void tFrmNew::zoomReleased(Release release) {
+void tFrmNew::zoomReleased(HeldButton::End how) {
     const unsigned opening = m_openings;
-    if (release == Release::MouseUp)
+    if (how == HeldButton::End::LetGo)
         m_platform.pump.pump();
     if (!m_open || opening != m_openings)
         return; // another picture was opened meanwhile

@@ -194,7 +194,7 @@ void RedI::beginHold(Ticker& timer) {
 }
 
 void RedI::endArrow() {
-    stopHolds();
+    endHold();
     if (!canCorrect())
         return;
     m_step = Step::Aim;

@@ -66,12 +66,11 @@ public:
     // The circle's size
     void Image10_MouseDown() { holdSize(-1); }
     void Image11_MouseDown() { holdSize(1); }
-    void Size_MouseUp() { stopHolds(); }
+    void Size_MouseUp() { endHold(); }
     void Timer1_Tick() { resizeOnce(); }
     void Combo1_Change(int index) { turnWheel(index); }
-    // Makes a press that ends before the first tick count as one; a view calls it ahead of the MouseUp.
-    void tickOnceIfNone() { m_held.tickOnceIfNone(); }
-    void stopHolds() { m_held.release(); }
+    // Ends a held button: the pointer was lost, or the page went. A button that has not ticked does nothing.
+    void stopHolds() { m_held.end(HeldButton::End::Lost); }
 
     // Corrections
     void RedFix(int level);
@@ -135,6 +134,7 @@ private:
     void place(QPoint centre);
     void magnify(int to);
     void beginHold(Ticker& timer);
+    void endHold() { m_held.end(HeldButton::End::LetGo); }
     void endArrow();
     void moveCircle(const Ticker& timer, int right, int down);
     void holdSize(int step);

@@ -127,7 +127,6 @@ void RedEyeCanvas::keyPressEvent(QKeyEvent* event) {
 // A key moves the circle as a tap of the arrow's button does.
 void RedEyeCanvas::tap(void (RedI::*arrowDown)()) {
     (m_page.*arrowDown)();
-    m_page.tickOnceIfNone();
     m_page.Arrow_MouseUp();
 }
 

@@ -21,9 +21,7 @@ HoldButton::HoldButton(Handlers handlers, QWidget* parent)
 void HoldButton::end(End how) {
     if (!std::exchange(m_held, false))
         return;
-    if (how == End::LetGo)
-        m_handlers.tap();
-    m_handlers.up();
+    how == End::LetGo ? m_handlers.up() : m_handlers.lost();
 }
 
 void HoldButton::changeEvent(QEvent* event) {

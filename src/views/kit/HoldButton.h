@@ -6,17 +6,15 @@
 
 namespace lumora {
 
-// A button that works as long as it is held. The page's own timer does the work: down() starts it, up() ends it, also
-// when the pointer or the keyboard leaves the button, or the button is hidden or disabled under it. tap() comes before
-// up() when the button was released and not lost: the page then makes one step if its timer has not ticked yet, so that
-// a tap is one step.
+// A button that works as long as it is held. The page's own timer does the work: down() starts it, up() ends it when
+// the button is released, and lost() when the keyboard leaves it, or it is hidden or disabled under the pointer.
 class HoldButton : public QPushButton {
     Q_OBJECT
 public:
     struct Handlers {
         std::function<void()> down;
-        std::function<void()> tap;
         std::function<void()> up;
+        std::function<void()> lost;
     };
     // Without handlers it is a plain button.
     HoldButton(Handlers handlers, QWidget* parent);

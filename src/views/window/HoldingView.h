@@ -19,7 +19,7 @@ protected:
                     handler();
             };
         };
-        return {std::move(down), whilePageIsThere(this->toPage(&P::tickOnceIfNone)), whilePageIsThere(std::move(up))};
+        return {std::move(down), whilePageIsThere(std::move(up)), whilePageIsThere(this->toPage(&P::stopHolds))};
     }
 };
 
