@@ -19,4 +19,8 @@ void CaptionGuard::begin(EditFields& edit) const {
         CaptionStep::begin(edit);
 }
 
+bool CaptionGuard::keepsDraggedPlace() const {
+    return m_state.Careful;
+}
+
 } // namespace lumora

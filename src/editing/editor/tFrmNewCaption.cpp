@@ -11,10 +11,15 @@ void tFrmNew::writeCaption() {
     if (!m_open)
         return;
     stopHolds();
+    hidePanels();
     if (m_edit.TextOn == 0) {
         m_captionGuard.begin(m_edit);
         PlaceTextLabel();
-        RenderPreview();
+        // A caption that was removed has its text, and prints from now on.
+        if (m_edit.TextBody.isEmpty())
+            RenderPreview();
+        else
+            packRenderStore();
     }
     m_chain.load<mikledet>().open(m_edit.TextBody, m_edit.TextOn == 1);
     m_chain.follow(pageId, Outcome::CaptionWanted);
@@ -68,7 +73,7 @@ void tFrmNew::dragCaption(QPointF at) {
     Q_EMIT changed();
 }
 
-// The caption is stored without packing: the record takes its new place at the next pack.
+// As built in, the caption is stored without packing: the record takes its new place at the next pack.
 void tFrmNew::endCaptionDrag() {
     if (!m_labelHandle.held())
         return;
@@ -76,8 +81,12 @@ void tFrmNew::endCaptionDrag() {
     const QPoint anchor = TextLabelPlace::anchorOf(LabeltextBox, m_edit);
     m_edit.TextX = static_cast<std::int16_t>(anchor.x());
     m_edit.TextY = static_cast<std::int16_t>(anchor.y());
+    if (m_captionGuard.keepsDraggedPlace())
+        PackEditState();
     RenderPreview();
     StoreCurrentEdit();
+    if (anchor != QPoint(m_edit.TextX, m_edit.TextY)) // held within the columns of the record
+        PlaceTextLabel();
 }
 
 } // namespace lumora
