@@ -3,6 +3,7 @@
 #include "editing/render/EditedPicture.h"
 
 #include <functional>
+#include <tuple>
 
 namespace lumora {
 namespace {
@@ -143,13 +144,13 @@ TEST_F(TheEditor, letsGoOfAHeldButtonWhenThePointerIsLostOrAnotherPictureComes) 
         editor.Timer2_Tick(); // one that was under way
         EXPECT_EQ(field(EditRecord::ZoomPercent), QLatin1String(zoom));
     }
-    editor.Image2_MouseDown(0);
     holdImage2(0, 0);
     EXPECT_EQ(field(EditRecord::ZoomPercent), u"106"_s) << "a tap is one step";
     editor.VScrollZ_Change(150);
     editor.Image2_MouseDown(0);
     editor.stopHolds();
     EXPECT_EQ(field(EditRecord::ZoomPercent), u"106"_s) << "lost before the first step";
+    editor.Image2_MouseDown(0);
     editor.Timer2_Tick();
     UnpackEditState(EditRecord::newPicture(), state.edit);
     state.edit.PicturePath = standing;
@@ -237,7 +238,7 @@ TEST_F(TheEditor, leavesAPictureThatCannotBeOpenedUnedited) {
          {&tFrmNew::Image15_Click, &tFrmNew::Image18_Click, &tFrmNew::Image4_Click, &tFrmNew::Image5_Click,
           &tFrmNew::Image20_Click, &tFrmNew::Image22_Click, &tFrmNew::Image28_Click, &tFrmNew::Command4_Click,
           &tFrmNew::Command5_Click, &tFrmNew::Command6_Click, &tFrmNew::Command8_Click, &tFrmNew::Command9_Click,
-          &tFrmNew::Command11_Click, &tFrmNew::Command14_Click})
+          &tFrmNew::Command11_Click, &tFrmNew::Command14_Click, &tFrmNew::CommandImprove_Click})
         (editor.*press)();
     hold(right, 1);
     editor.Misgerett_Click(true);
@@ -312,6 +313,35 @@ TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
     EXPECT_EQ(surfaces.controls().List1.count(), 61 * 46);
     open(standing, measured);
     EXPECT_EQ(surfaces.controls().List1.count(), 61 * 81) << "measured anew";
+}
+
+TEST_F(TheEditor, improvesByTheMeasuredGainsWithinTheirLimitsAndOnce) {
+    const DrivePath picture = u"C:\\p\\even.jpg"_path;
+    for (const auto& [colour, gains, improved] : // 255 by the value and 0.2, cut after two digits
+         {std::tuple(QColor(204, 170, 128), u"1.241.491.6 "_s, QColor(253, 253, 205)),
+          {QColor(255, 250, 40), u"1   1.011.6 "_s, QColor(255, 253, 64)}}) {
+        ASSERT_TRUE(Bitmap(400, 300, colour).image().save(toText(host(picture)), "PNG"));
+        tFrmNew& editor = open(picture);
+        const QImage before = paper();
+        machine.dialogs.messages.clear();
+        editor.CommandImprove_Click();
+        ASSERT_EQ(stored.size(), 1);
+        EXPECT_EQ(stored.last().left(12) + field(EditRecord::AutoMarker), gains + u"000"_s);
+        for (const int shift : {0, 8, 16})
+            EXPECT_NEAR(middle().rgb() >> shift & 255, improved.rgb() >> shift & 255, 2);
+        const QImage seen = paper();
+        editor.CommandImprove_Click();
+        EXPECT_EQ(machine.dialogs.messages.size(), 1) << "nothing more to improve";
+        open(picture, QString(state.edit.EditState));
+        EXPECT_EQ(paper(), seen) << "what was seen is what opens again";
+        editor.Image2_Click(5);
+        EXPECT_EQ(stored.last().left(12), u"1   1   1   "_s);
+        EXPECT_EQ(paper(), before);
+        editor.Image11_Click();
+        editor.CommandImprove_Click();
+        EXPECT_EQ(stored.last().left(12), u"1.3 1   0.8 "_s) << "the tint of a tone stays";
+        EXPECT_EQ(machine.dialogs.messages.size(), 2);
+    }
 }
 
 TEST_F(TheEditor, leavesForAnotherFolderOnlyWhenAPictureWasPicked) {

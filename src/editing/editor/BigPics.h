@@ -21,7 +21,7 @@ struct BigPicsControls : Controls {
     TextList List2{*this, u"List2"};     // of green
     TextList List3{*this, u"List3"};     // of blue
 
-    // What the level step found. No page reads it.
+    // What the level step found.
     struct AutoLevels {
         ChannelValues gains{};
         ChannelValues floors{};

@@ -1,7 +1,10 @@
 #include "editing/editor/ColourStep.h"
 
+#include "common/FixedText.h"
 #include "order/EditRecord.h"
 #include "session/SessionState.h"
+
+#include <algorithm>
 
 namespace lumora::ColourStep {
 namespace {
@@ -31,6 +34,14 @@ void addBlue(EditFields& edit) {
 
 void removeAddedColours(EditFields& edit) {
     setGains(edit, edit.GainG, edit.GainG, edit.GainG);
+}
+
+void improve(EditFields& edit, const ChannelValues& measured) {
+    const auto held = [](float gain) {
+        const QString text = PlainNumber(std::clamp(gain, 1.0F, 1.6F));
+        return static_cast<float>(Val(text.left(EditRecord::GainR.width)));
+    };
+    setGains(edit, held(measured[0]), held(measured[1]), held(measured[2]));
 }
 
 void takeTone(EditFields& edit, Tone tone) {

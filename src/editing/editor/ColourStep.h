@@ -1,5 +1,7 @@
 #pragma once
 
+#include "editing/render/ColourLevels.h"
+
 namespace lumora {
 
 struct EditFields;
@@ -16,6 +18,8 @@ void addRed(EditFields& edit);
 void addBlue(EditFields& edit);
 // Sets all gains to that of green, which added colours do not change.
 void removeAddedColours(EditFields& edit);
+// Sets the gains to those that were measured, held within 1.0 and 1.6 and cut to what the record's columns carry.
+void improve(EditFields& edit, const ChannelValues& measured);
 void takeTone(EditFields& edit, Tone tone);
 void backToColour(EditFields& edit);
 // Sets gains, tone, zoom and turn as in a new record.

@@ -73,6 +73,7 @@ public:
     void Image29_Click() { turnHints(); }
     void Command8_Click() { writeCaption(); }
     void Command6_Click() { measureLevels(); }
+    void CommandImprove_Click() { improve(); }
     void Command4_Click() { lookQuickly(); }
     // Paper of the next picture that is opened.
     void Command24_Click() { choosePaper(QStringLiteral("1014")); }
@@ -218,6 +219,7 @@ private:
     void useTool(int index);
     void changeColours(void (*step)(EditFields& edit));
     void takeTone(Tone tone);
+    void improve();
     void backToColour();
     void undoAllEdits();
     void correctRedEyes();
@@ -235,6 +237,7 @@ private:
     void showFrames(bool on);
     void tellFrameTakenOut();
     const std::optional<Bitmap>& frame(const EditFields& fields);
+    void tellNotImproved();
     void stepLineStyle(int places);
     void moveMarker(QPointF at);
     void takeLineColour();

@@ -5,6 +5,8 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
+#include <array>
+
 namespace lumora {
 
 // The record is stored when the button is let go.
@@ -37,6 +39,21 @@ void tFrmNew::changeColours(void (*step)(EditFields& edit)) {
     if (!m_open)
         return;
     step(m_edit);
+    renderPackStore();
+}
+
+// The gains are measured on the work picture, which has none of them, so that a second press changes nothing more.
+// Those of a tone are its tint and stay.
+void tFrmNew::improve() {
+    if (!m_open)
+        return;
+    const std::array before{m_edit.GainR, m_edit.GainG, m_edit.GainB};
+    if (m_edit.ToneFlag != 1) {
+        surfaces().measureLevels();
+        ColourStep::improve(m_edit, surfaces().controls().levels.gains);
+    }
+    if (before == std::array{m_edit.GainR, m_edit.GainG, m_edit.GainB})
+        return tellNotImproved();
     renderPackStore();
 }
 

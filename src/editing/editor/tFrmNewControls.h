@@ -53,7 +53,8 @@ struct tFrmNewControls : Controls {
         Image13{*this, u"Image13"}, Image20{*this, u"Image20"}, Image21{*this, u"Image21"}, Image22{*this, u"Image22"},
         Image28{*this, u"Image28"}, Image29{*this, u"Image29"}, Command2{*this, u"Command2"},
         Command4{*this, u"Command4"}, Command6{*this, u"Command6"}, Command8{*this, u"Command8"},
-        Command9{*this, u"Command9"}, Command18{*this, u"Command18"}, CommandDone{*this, u"CommandDone"};
+        Command9{*this, u"Command9"}, Command18{*this, u"Command18"}, CommandDone{*this, u"CommandDone"},
+        CommandImprove{*this, u"CommandImprove"};
     Caption Command10{*this, u"Command10", Caption::At::Hidden}; // the paper sizes
     Caption Command12{*this, u"Command12", Caption::At::Hidden}, Command23{*this, u"Command23", Caption::At::Hidden},
         Command24{*this, u"Command24", Caption::At::Hidden};

@@ -46,6 +46,8 @@ void tFrmNew::setTexts() {
             {Command2, u"תמונה אחרת", u"Another picture"},
             {Command6, u"תיקון אוטומטי", u"Automatic levels", u"מודד את בהירות התמונה",
              u"Measures the levels of the picture"},
+            {CommandImprove, u"שפר תמונה", u"Improve", u"מבהיר את התמונה ומאזן את צבעיה",
+             u"Brightens the picture and balances its colours"},
             {CommandDone, u"חזרה לתמונות", u"Back to the pictures", u"כל השינויים נשמרו", u"All changes are kept"},
             {Misgerett, u"הצג מסגרת", u"Show the frame"},
             {Command9, u"סגנון הבא", u"Next style"},
@@ -104,6 +106,16 @@ void tFrmNew::tellFrameTakenOut() {
     m_platform.dialogs.message(m_state.wording(
         u"המסגרת הוסרה מהתמונה ולא תודפס. כדי להחזיר אותה יש לבחור אותה שוב"_s,
         u"The frame was taken off the picture and will not be printed. Choose it again to bring it back"_s));
+}
+
+void tFrmNew::tellNotImproved() {
+    m_platform.dialogs.message(
+        m_edit.ToneFlag == 1
+            ? m_state.wording(u"אפשר לשפר רק תמונה בצבע מלא. יש ללחוץ על גוונים ולבחור צבע מלא"_s,
+                              u"Only a picture in full colour can be improved. Press Tones and choose Full colour"_s)
+            : m_state.wording(
+                  u"האור והצבעים של התמונה כבר טובים, ואין מה לשפר"_s,
+                  u"The light and colours of this picture are good already; there is nothing to improve"_s));
 }
 
 } // namespace lumora

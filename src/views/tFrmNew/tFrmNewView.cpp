@@ -140,12 +140,15 @@ QLayout* tFrmNewView::makeTurns() {
 
 QLayout* tFrmNewView::makeLight() {
     QGridLayout* grid = inGrid(Space::Tight);
-    grid->addWidget(zoomOrLight(3, u"darker"_s, wide), 0, 0, 1, 3);
-    grid->addWidget(zoomOrLight(4, u"lighter"_s, wide), 0, 3, 1, 3);
-    grid->addWidget(colour(6, u"drop"_s, QColor(0xC8, 0x3A, 0x32)), 1, 0, 1, 2);
-    grid->addWidget(colour(10, u"drop"_s, QColor(0x2F, 0x5F, 0xA8)), 1, 2, 1, 2);
-    grid->addWidget(colour(8, u"drop-off"_s, Theme::Colour::Ink), 1, 4, 1, 2);
-    for (int i = 0; i < 6; ++i)
+    ToolButton* improve = tool(c.CommandImprove, u"improve"_s, narrow, &tFrmNew::CommandImprove_Click);
+    improve->setInk(Theme::Colour::Primary);
+    grid->addWidget(improve, 0, 0);
+    grid->addWidget(zoomOrLight(3, u"darker"_s, narrow), 0, 1);
+    grid->addWidget(zoomOrLight(4, u"lighter"_s, narrow), 0, 2);
+    grid->addWidget(colour(6, u"drop"_s, QColor(0xC8, 0x3A, 0x32)), 1, 0);
+    grid->addWidget(colour(10, u"drop"_s, QColor(0x2F, 0x5F, 0xA8)), 1, 1);
+    grid->addWidget(colour(8, u"drop-off"_s, Theme::Colour::Ink), 1, 2);
+    for (int i = 0; i < 3; ++i)
         grid->setColumnStretch(i, 1);
     return grid;
 }
