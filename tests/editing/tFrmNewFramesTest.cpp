@@ -82,6 +82,8 @@ TEST_F(TheEditor, recordsLineFramesAndPaintsThemNowhere) {
     editor.Command18_Click(); // the first stays and is taken again
     EXPECT_EQ(stored.last().mid(35, 3), u"Y01"_s);
     EXPECT_EQ(shown().Combo5.text, u"1"_s);
+    editor.Combo5_Click(3);
+    EXPECT_EQ(stored.last().mid(35, 3), u"Y06"_s);
     EXPECT_EQ(paper(), before);
 }
 

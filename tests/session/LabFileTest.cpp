@@ -41,6 +41,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
+              "[Operator]\nArea = no\nEditor = yes\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -55,7 +56,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_EQ(profile.JppChunks, 32767);
     EXPECT_TRUE(lab.SugTzad == 60 && lab.ftpType == FtpType::Image && lab.HaKoopon == 1 && lab.MinuyPaar == 2);
     EXPECT_TRUE(lab.keptFtpSession && !lab.DchisatAlbum && lab.SplitPage && lab.FitMuzag && lab.DoarReshut &&
-                lab.TachanaMekomit);
+                lab.TachanaMekomit && !lab.OperatorArea && lab.OperatorEditor);
     EXPECT_TRUE(lab.GvulMuzag == 0 && lab.TmunatPaar == 1 && profile.ReportOn == 0 && lab.MediniyutDchisa == 1);
     const MailAccount& mail = lab.profile.mail;
     EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
@@ -168,7 +169,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     // The keys whose example is not the built-in value.
     EXPECT_TRUE(given.Careful && !given.OperatorArea && given.transfer.keptFtpSession);
     EXPECT_EQ(given.albumTail, AlbumTail::Photographer);
-    EXPECT_TRUE(!builtIn.Careful && builtIn.OperatorArea && !builtIn.transfer.keptFtpSession);
+    EXPECT_TRUE(!builtIn.Careful && builtIn.OperatorArea && !builtIn.DegelEdit && !builtIn.transfer.keptFtpSession);
     EXPECT_EQ(builtIn.albumTail, AlbumTail::Customer);
 }
 

@@ -103,6 +103,7 @@ void tFrmNew::OpenPictureInEditor() {
     ++m_openings;
     m_open = false;
     m_frameKey.clear();
+    crop.visible = false;
     surfaces().close();
     PicPic = Bitmap();
     m_coverZoom.forget();

@@ -137,6 +137,7 @@ public:
     void Misgerett_Click(bool checked) { showFrames(checked); }
     void Command9_Click() { stepLineStyle(1); }
     void Command18_Click() { stepLineStyle(-1); }
+    void Combo5_Click(int index) { chooseLineStyle(index); }
     void pic4Msgrt_MouseMove(QPointF at) { moveMarker(at); } // positions of the palette
     void PicInMsgrt_Click() { takeLineColour(); }
 
@@ -218,8 +219,8 @@ private:
     // Colours.
     void useTool(int index);
     void changeColours(void (*step)(EditFields& edit));
-    void takeTone(Tone tone);
     void improve();
+    void takeTone(Tone tone);
     void backToColour();
     void undoAllEdits();
     void correctRedEyes();
@@ -236,9 +237,10 @@ private:
     void removeFrame();
     void showFrames(bool on);
     void tellFrameTakenOut();
-    const std::optional<Bitmap>& frame(const EditFields& fields);
     void tellNotImproved();
+    const std::optional<Bitmap>& frame(const EditFields& fields);
     void stepLineStyle(int places);
+    void chooseLineStyle(int index);
     void moveMarker(QPointF at);
     void takeLineColour();
 

@@ -145,6 +145,10 @@ void tFrmNew::stepLineStyle(int places) {
     packRenderStore();
 }
 
+void tFrmNew::chooseLineStyle(int index) {
+    stepLineStyle(index - m_lineFrame.style());
+}
+
 void tFrmNew::moveMarker(QPointF at) {
     palette.moveTo(at);
     Label4.text = QString::number(palette.index());

@@ -43,7 +43,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.DoarReshut = deployment.DoarReshut;
     state.FitMuzag = deployment.FitMuzag;
     state.GvulMuzag = deployment.GvulMuzag;
-    state.DegelEdit = false;
+    state.DegelEdit = deployment.OperatorEditor;
     state.MinuyPaar = deployment.MinuyPaar;
     state.TmunatPaar = deployment.TmunatPaar;
     state.SplitPage = deployment.SplitPage;

@@ -31,6 +31,7 @@ struct Deployment {
     std::int16_t SugTzad = 40;
     bool Careful = false;
     bool OperatorArea = true;
+    bool OperatorEditor = false;
     AlbumTail albumTail = AlbumTail::Customer;
 
     QChar programLetter = u'C'; // letter of the program's own drive

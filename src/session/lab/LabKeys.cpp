@@ -234,6 +234,7 @@ std::vector<Row> rows() {
         {"Guards", "Careful", yesNo(at(&D::Careful), true, false)},
 
         {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
+        {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},
 
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",

@@ -140,7 +140,7 @@ void tFrmNewView::makeOperatorPanel() {
                        plain(c.Command6, &tFrmNew::Command6_Click)});
     m_palette = new Palette(m_page, m_operatorPanel);
     bind(u"pic4Msgrt"_s, m_palette, [this] { return c.Label4.text; });
-    m_lineStyles = comboBox(c.Combo5List, c.Combo5, [](int) {});
+    m_lineStyles = comboBox(c.Combo5List, c.Combo5, toPage(&tFrmNew::Combo5_Click));
     QLayout* lines = inRow(Space::Small, {m_palette, m_lineStyles, plain(c.Command18, &tFrmNew::Command18_Click),
                                           plain(c.Command9, &tFrmNew::Command9_Click)});
     auto* bar = new QSlider(Qt::Horizontal, m_operatorPanel);
