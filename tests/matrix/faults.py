@@ -180,7 +180,7 @@ FTP = [
     Fault('a black hole', host='blackhole', only=('scripted',), clock=60),
     Fault('IPv6 only', host='ipv6'),
     Fault('connects and stays silent', {'CONNECT': hang}, clock=120, only=('scripted',)),
-    Fault('connects and stays silent, twice', {'CONNECT': (hang, 2, 3)}, clock=20),
+    Fault('connects and stays silent, twice', {'CONNECT': (hang, 2, (3, 2))}, clock=20),
     Fault('two files wait in vain, then not', {'CONNECT': (hang, 10)}, clock=60),
     Fault('too many clients, twice', {'CONNECT': (bye('421 Too many connections'), 2, 2)}, quick=True),
     Fault('too many clients, always', {'CONNECT': bye('421 Too many connections')}),
