@@ -19,6 +19,7 @@ namespace lumora {
 struct Shop {
     QString name;
     QString phone;
+    bool operator==(const Shop&) const = default;
 };
 
 // A branch at which a coupon order is fetched: the button's caption and what its card says.
@@ -27,6 +28,7 @@ struct Branch {
     QString name;
     std::array<QString, 2> address; // up to two lines
     QString phone;
+    bool operator==(const Branch&) const = default;
 };
 
 // The client profile: which lab this copy serves. Set by LoadDefaultProfile from the built-in values and the
@@ -67,6 +69,7 @@ struct ClientProfile {
     MailAccount mail;                // finished orders go through it; not set up: no mail step
     std::array<Shop, 2> Shops;       // rows of the delivery question
     std::array<Branch, 11> Branches; // ten shops, then home delivery
+    bool operator==(const ClientProfile&) const = default;
 };
 
 // The details of one order.

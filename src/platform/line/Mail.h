@@ -24,6 +24,7 @@ struct MailAccount {
 
     // Without a server there is no mail step.
     bool setUp() const { return !host.isEmpty(); }
+    bool operator==(const MailAccount&) const = default;
 };
 
 // One message with one file.

@@ -37,6 +37,8 @@ struct Deployment {
     QChar programLetter = u'C'; // letter of the program's own drive
     QString dataFolder;         // host folder behind it; empty: the user's data folder
     QString driveOrder;         // letters in the order in which drives are offered, "EDZ"; the others follow
+
+    bool operator==(const Deployment&) const = default;
 };
 
 } // namespace lumora
