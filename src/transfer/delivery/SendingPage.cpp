@@ -94,12 +94,11 @@ QString SendingPage::advice(const PhaseLook& row) const {
 QString SendingPage::adviceOf(const PhaseLook& row) const {
     if (row.phase == SendingPhase::Waiting && isAnswerAwaited())
         return wording(answerAwaitedAdvice);
-    const QString text = advice(row);
-    if (m_state.transfer.leftOut.isEmpty())
-        return text;
-    if (row.phase == SendingPhase::Reporting)
+    const bool lacksChosen = !m_state.transfer.leftOut.isEmpty();
+    if (lacksChosen && row.phase == SendingPhase::Reporting)
         return wording(partReportingAdvice);
-    return hasArrived(row.phase) && text == wording(sentAdvice) ? wording(partSentAdvice) : text;
+    const bool countIsTold = m_lacking && row.phase == SendingPhase::AllThere;
+    return lacksChosen && row.tellsWhole && !countIsTold ? wording(partSentAdvice) : advice(row);
 }
 
 void SendingPage::goOnWithout() {

@@ -60,7 +60,8 @@ struct PhaseLook {
     SendingButton main; // has the focus; None if there is no choice
     SendingButtons buttons;
     SendingWords title;
-    SendingWords advice; // what the customer can do
+    SendingWords advice;     // what the customer can do
+    bool tellsWhole = false; // the advice says that the whole order has arrived
 };
 
 } // namespace lumora

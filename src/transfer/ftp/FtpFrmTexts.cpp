@@ -48,7 +48,7 @@ std::span<const PhaseLook> FtpFrm::looks() const {
         PhaseLook{SendingPhase::Sending, SendingSign::Percent, None, {Stop}, sendingTitle, sendingAdvice},
         PhaseLook{SendingPhase::Checking, SendingSign::Percent, None, {Stop}, sendingTitle, checkingAdvice},
         PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {Stop}, sendingTitle, reportingAdvice},
-        PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
+        PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice, true},
         // %1: files on the server, %2: files of the order; likewise in the next row.
         PhaseLook{SendingPhase::AllThere,
                   SendingSign::Good,

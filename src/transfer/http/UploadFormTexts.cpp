@@ -71,8 +71,8 @@ std::span<const PhaseLook> UploadForm::looks() const {
         PhaseLook{SendingPhase::Sending, SendingSign::Percent, None, {Stop}, sendingTitle, sendingAdvice},
         PhaseLook{SendingPhase::Checking, SendingSign::Asking, None, {Stop}, sendingTitle, checkingAdvice},
         PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {Stop}, sendingTitle, reportingAdvice},
-        PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
-        PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice},
+        PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice, true},
+        PhaseLook{SendingPhase::AllThere, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice, true},
         PhaseLook{
             SendingPhase::CallLab, SendingSign::Bad, NewOrder, {NewOrder, Close}, notCompleteTitle, callLabAdvice},
         PhaseLook{SendingPhase::NotAll,
