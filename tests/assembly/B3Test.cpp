@@ -3,6 +3,7 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/files/PictureFile.h"
 #include "order/OrderCheck.h"
+#include "support/JpegQuality.h"
 
 #include <QPainter>
 
@@ -37,6 +38,7 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     request.file = host(portrait);
     request.paper = {10, 15};
     EXPECT_EQ(content->picture, *renderEditedPrintToJpeg(request, fields));
+    EXPECT_EQ(jpegQuality(content->picture), 90);
 
     EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{450, 580}));
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));

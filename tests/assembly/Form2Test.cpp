@@ -2,6 +2,7 @@
 
 #include "assembly/PaperResize.h"
 #include "order/OrderCheck.h"
+#include "support/JpegQuality.h"
 
 namespace lumora {
 namespace {
@@ -19,6 +20,8 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(print->picture, *resizeToPaper(host(portrait), {10, 15}));
     EXPECT_EQ(print->tail, "1 1 03-1234567Dana Levi 13 1051234      ");
     EXPECT_EQ(QImage::fromData(print->picture).size(), QSize(1200, 1600));
+    EXPECT_EQ(jpegQuality(print->picture), 90);
+    EXPECT_EQ(jpegQuality(*machine.files.read(folder() / u"!105_1234.jpp")), 90);
     EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{500, 480}));
 
     EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");

@@ -132,40 +132,6 @@ QRect darkBox(const Bitmap& paper) {
     return ink;
 }
 
-QRect inkOfCaption(PictureCaption::Align align, PictureCaption::Run run, double scale = 1) {
-    PictureCaption caption = captionAt(200, u"HHHH\r\nH"_s, 24);
-    caption.align = align;
-    caption.run = run;
-    caption.y = 150;
-    Bitmap paper(static_cast<int>(400 * scale), static_cast<int>(300 * scale), Qt::white);
-    drawInk(paper, inkOf(caption, {paper.width(), paper.height()}, {scale, scale}));
-    return darkBox(paper);
-}
-
-TEST(CaptionDraw, StartsIsCentredOrEndsAtItsAnchor) {
-    using Align = PictureCaption::Align;
-    using Run = PictureCaption::Run;
-    // Four letters of 0.752 em and a third of an em; the base line of the first line is 22 below the anchor, the pitch
-    // 28. The letter's own bearing is a tenth of an em.
-    const double length = 24 * (4 * 0.752 + 1 / 3.0);
-    for (const auto& [align, start] :
-         {std::pair(Align::Near, 0.0), {Align::Centre, -length / 2}, {Align::Far, -length}}) {
-        const QRect across = inkOfCaption(align, Run::Across);
-        EXPECT_NEAR(across.left(), 200 + start + 24 / 6.0 + 2.4 - 2, 1.6);
-        EXPECT_NEAR(across.top(), 150 + 22 - 17.5 - 2, 1.6);
-        EXPECT_NEAR(across.bottom(), 150 + 22 + 28, 1.6);
-        EXPECT_NEAR(across.width(), 4 * 0.752 * 24 - 4.8 + 2, 2.6) << "the second line lies within the first";
-        const QRect down = inkOfCaption(align, Run::Down);
-        EXPECT_NEAR(down.top(), 150 + start + 24 / 6.0 + 2.4 - 2, 1.6);
-        EXPECT_NEAR(down.right(), 200 - (22 - 17.5), 1.6);
-        EXPECT_LT(down.right(), 200);
-    }
-    const QRect small = inkOfCaption(Align::Centre, Run::Across);
-    const QRect large = inkOfCaption(Align::Centre, Run::Across, 10 / 3.0);
-    EXPECT_NEAR(large.left(), small.left() * 10 / 3.0, 4);
-    EXPECT_NEAR(large.width(), small.width() * 10 / 3.0, 6);
-}
-
 TEST(CaptionDraw, LeavesOutAFontThatIsMissingAndDrawsDavidOnPicturesAndSheet) {
     for (const auto& [name, shows] : {std::pair(u"No Such Family"_s, false), std::pair(u"David"_s, true)}) {
         PictureCaption caption = captionAt(0, u"שלום Lumora\r\n2024"_s, 24);

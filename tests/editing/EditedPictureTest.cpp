@@ -9,8 +9,11 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <cmath>
+#include <cstdlib>
 #include <tuple>
+#include <vector>
 
 namespace lumora {
 namespace {
@@ -117,6 +120,103 @@ TEST_F(EditedPictureTest, thePrintReducedToThePreviewIsThePreview) {
     EXPECT_GT(differs("1   1   1   195150257 140 0  0  000"), 3.0);
     EXPECT_GT(differs("1   1   1   202150245 140 0  0  000"), 3.0);
     EXPECT_GT(differs("1.1 1   1   195150245 140 0  0  000"), 3.0);
+}
+
+// A caption on white: all of it, and its letters without their shadow.
+struct CaptionSeen {
+    double scale = 1; // pixels for one of the preview
+    QRectF all, letters;
+    double ink = 0;        // pixels of the letters
+    double atRight = 0;    // share of them in the right half
+    double leansRight = 0; // how far their upper half stands right of the lower one
+};
+
+CaptionSeen captionIn(const QImage& image, double scale) {
+    QRect all, letters;
+    std::vector<QPoint> points;
+    for (int y = 0; y < image.height(); ++y) {
+        for (int x = 0; x < image.width(); ++x) {
+            const QRgb c = image.pixel(x, y);
+            if ((c & 0xFFFFFF) == 0xFFFFFF)
+                continue;
+            all |= QRect(x, y, 1, 1);
+            if (std::abs(qRed(c) - 250) + std::abs(qGreen(c) - 30) + std::abs(qBlue(c) - 90) < 100) {
+                letters |= QRect(x, y, 1, 1);
+                points.emplace_back(x, y);
+            }
+        }
+    }
+    const auto scaled = [scale](const QRect& r) {
+        return QRectF(r.x() / scale, r.y() / scale, r.width() / scale, r.height() / scale);
+    };
+    CaptionSeen seen{scale, scaled(all), scaled(letters), static_cast<double>(points.size())};
+    const QPoint middle = letters.center();
+    double sum[2] = {}, count[2] = {};
+    for (const QPoint point : points) {
+        seen.atRight += (point.x() > middle.x()) / seen.ink;
+        sum[point.y() > middle.y()] += point.x() / scale;
+        ++count[point.y() > middle.y()];
+    }
+    seen.leansRight = sum[0] / count[0] - sum[1] / count[1];
+    return seen;
+}
+
+TEST_F(EditedPictureTest, aCaptionHasItsColourPlaceSizeAndStyleInPreviewAndPrint) {
+    Bitmap(400, 300, Qt::white).image().save(at("white.png"));
+    EditFields base = fieldsOf(u"1   1   1   180100225 150 0  0  000"_s);
+    base.TextOn = 1;
+    base.TextFont = u"DejaVu Sans"_s;
+    base.TextBody = u"HH\r\nH"_s;
+    base.TextFontSize = 40;
+    base.TextX = 200;
+    base.TextY = 100;
+    base.TextRed = 250;
+    base.TextGreen = 30;
+    base.TextBlue = 90;
+    const auto seenIn = [&](const EditFields& edit) {
+        return std::array{captionIn(preview("white.png", edit).image(), 1),
+                          captionIn(print("white.png", edit).image(), 10 / 3.0)};
+    };
+    // By the em an H of this font is 0.752 wide with 0.098 free at both sides, and 0.729 high; the base line lies 0.928
+    // below the top of the line's box, and the pitch is 1.164. A line has a third of an em more than its letters.
+    for (const auto& [em, align, vertical] :
+         {std::tuple(40, 0, 0), {40, 1, 0}, {40, 2, 0}, {60, 0, 0}, {40, 0, 3}, {40, 1, 3}, {40, 2, 3}}) {
+        EditFields edit = base;
+        edit.TextFontSize = static_cast<std::int16_t>(em);
+        edit.TextAlign = static_cast<std::int16_t>(align);
+        edit.TextVertical = static_cast<std::int16_t>(vertical);
+        const double along = em * (1 / 6.0 + 0.098 - (2 * 0.752 + 1 / 3.0) * align / 2),
+                     length = em * (2 * 0.752 - 2 * 0.098);
+        const double below = em * (0.928 - 0.729), height = em * (0.729 + 1.164);
+        const QRectF wanted = vertical == 0 ? QRectF(198 + along, 98 + below, length, height)
+                                            : QRectF(198 - below - height, 98 + along, height, length);
+        for (const CaptionSeen& seen : seenIn(edit)) {
+            SCOPED_TRACE(::testing::Message() << em << ' ' << align << ' ' << vertical << ' ' << seen.scale);
+            for (const auto side : {&QRectF::left, &QRectF::top, &QRectF::right, &QRectF::bottom}) {
+                EXPECT_NEAR((seen.letters.*side)(), (wanted.*side)(), 1.2);
+                const bool shadowSide = side == &QRectF::right || side == &QRectF::bottom;
+                EXPECT_NEAR((seen.all.*side)(), (wanted.*side)() + (shadowSide ? 2 : 0), 1.2) << "with the shadow";
+            }
+        }
+    }
+    base.TextBody = u"HH"_s;
+    const auto plain = seenIn(base);
+    for (const int style : {1, 2, 3}) {
+        base.TextStyle = static_cast<std::int16_t>(style);
+        const auto styled = seenIn(base);
+        for (const std::size_t i : {0, 1}) {
+            SCOPED_TRACE(style);
+            EXPECT_EQ(styled[i].ink > 1.3 * plain[i].ink, (style & 1) != 0);
+            EXPECT_EQ(styled[i].leansRight > plain[i].leansRight + 1, (style & 2) != 0);
+        }
+    }
+    base.TextStyle = 0;
+    base.TextFont = u"David"_s;
+    for (const auto& [text, fromRight] : {std::pair(u"שיי"_s, true), {u"Wii"_s, false}}) {
+        base.TextBody = text;
+        for (const CaptionSeen& seen : seenIn(base))
+            EXPECT_EQ(seen.atRight > 0.5, fromRight) << "its wide letter comes first";
+    }
 }
 
 TEST_F(EditedPictureTest, aPreviewForALargerScreenIsTheSamePicture) {

@@ -1,6 +1,7 @@
 #include "editing/editor/gdisave.h"
 
 #include "imaging/files/PictureFile.h"
+#include "support/JpegQuality.h"
 #include "support/PageRig.h"
 
 #include <gtest/gtest.h>
@@ -21,9 +22,10 @@ protected:
     }
 
     gdisave& page() { return chain.load<gdisave>(); }
-    bool isPicture(const DrivePath& path, PictureSize size) {
+    // The width and the quality of a picture; 0 where there is none.
+    std::pair<int, int> pictureIn(const DrivePath& path) {
         const Result<PictureSize> found = readPictureSize(host(path));
-        return found && *found == size;
+        return found ? std::pair(found->width, jpegQuality(read(path))) : std::pair(0, 0);
     }
 
     const Bitmap picture{20, 10, Qt::red};
@@ -37,9 +39,12 @@ TEST_F(SavingPictures, savesEachPictureUnderItsNameOnceTheDrawingStarted) {
         page().saveScratch(picture);
         page().saveOrderSheet(picture);
         page().saveProof(small);
-        EXPECT_EQ(isPicture(u"C:\\2000lumora\\!!000\\^^^.jpg"_path, {20, 10}), started);
-        EXPECT_EQ(isPicture(u"C:\\2000lumora\\000.jpg"_path, {8, 6}), started);
-        EXPECT_EQ(isPicture(state.transfer.OrderFolder / u"!105_1234.jpp", {20, 10}), started);
+        const auto expected = [started](int width, int quality) {
+            return started ? std::pair(width, quality) : std::pair(0, 0);
+        };
+        EXPECT_EQ(pictureIn(u"C:\\2000lumora\\!!000\\^^^.jpg"_path), expected(20, 80));
+        EXPECT_EQ(pictureIn(u"C:\\2000lumora\\000.jpg"_path), expected(8, 70));
+        EXPECT_EQ(pictureIn(state.transfer.OrderFolder / u"!105_1234.jpp"), expected(20, 90));
         EXPECT_EQ(machine.dialogs.messages,
                   QStringList({u"Gdiplus Not Initialized. GDI+ Error:18"_s, u"GDI+ not inizialized."_s}));
         startStatus = 0;

@@ -86,6 +86,7 @@ TEST_F(SpltFormTest, SplitOneCutsAPieceAndNothingElseAndACancelledPickChangesNot
     choose("a.jpp", &SpltForm::Command2_Click);
     for (auto click : {&SpltForm::Command2_Click, &SpltForm::Command8_Click, &SpltForm::Command9_Click})
         (page().*click)();
+    EXPECT_EQ(page().phase(), SpltForm::Phase::Idle);
     EXPECT_EQ(page().controls().List4files.count(), 2);
     EXPECT_EQ(page().controls().ListChalakim.count(), 0);
     choose("a_jpp_001_001.prk", &SpltForm::Command9_Click);

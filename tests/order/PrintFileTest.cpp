@@ -99,18 +99,11 @@ TEST(OrderTail, cutsEachFieldToItsWidthInBytesOfTheCodePage) {
     state.shemot.n2 = u"+972-3-1234567"_s;
     state.shemot.TotalPics = 1234;
     state.MisparHazmana = u"1005"_s;
-    const QByteArray tail = OrderTail::of(state).shortForm();
-    EXPECT_EQ(tail.size(), 40);
-    const std::optional<OrderTail> read = OrderTail::parse(tail);
-    ASSERT_TRUE(read);
-    EXPECT_EQ(read->telephone, u"+972-3-123"_s);
-    EXPECT_EQ(read->name, u"דנה לוי-כה"_s);
-    EXPECT_EQ(read->totalPics, u"123"_s);
-    EXPECT_EQ(read->orderNumber, u"100"_s);
-    EXPECT_EQ(read->serial, u"1234"_s);
+    EXPECT_EQ(OrderTail::of(state).shortForm(), "1 1 +972-3-123\xe3\xf0\xe4 \xec\xe5\xe9-\xeb\xe4"
+                                                "1231001234      ");
 
     state.shemot.n1 = QString::fromUtf8("\U0001F600\U0001F600");
-    EXPECT_EQ(OrderTail::of(state).shortForm().size(), 40) << "a character outside the code page is one byte";
+    EXPECT_EQ(OrderTail::of(state).shortForm().mid(14, 10), "??        ") << "outside the code page, one byte each";
 }
 
 TEST(OrderTail, carriesTenDigitsOfALongTelephoneAndAsksForMore) {
@@ -150,6 +143,7 @@ TEST(OrderTail, takesTheFormThatTheSessionAsksFor) {
     EXPECT_EQ(tail.form(60, u"exactly nineteen ch"_s), tail.shortForm() + "^exactly nineteen ch");
     EXPECT_EQ(tail.form(60, u"twentycharactersname"_s), tail.shortForm() + "^wentycharactersname");
     EXPECT_EQ(tail.form(0, name), QByteArray());
+    EXPECT_EQ(tail.form(60, u"תמונה"_s).mid(40), "^\xfa\xee\xe5\xf0\xe4              ");
     EXPECT_EQ(OrderTail::parse(tail.form(60, u"תמונה"_s))->baseName, u"תמונה"_s);
 }
 
