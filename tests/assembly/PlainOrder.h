@@ -5,12 +5,8 @@
 #include "order/PrintFile.h"
 #include "support/ExampleOrder.h"
 #include "support/PageRig.h"
-#include "support/SmallDisk.h"
 
 #include <gtest/gtest.h>
-
-#include <csignal>
-#include <sys/resource.h>
 
 namespace lumora {
 
@@ -69,39 +65,6 @@ protected:
             done = true;
             what();
         };
-    }
-
-    // The workspace on a disk that runs full in the middle of the order; prepare gives the paths that failed. Where
-    // this user may not mount a disk, files that may not grow beyond a limit stand in for it.
-    void expectFullDiskLosesNothing(const SmallDisk& disk,
-                                    const std::function<QStringList(const QStringList&)>& prepare) {
-        QStringList pictures;
-        for (int i = 0; i < 8; ++i) {
-            const int side = i % 2 == 0 ? 60 : 200;
-            pictures += giveFile(u"picture%1.jpg"_s.arg(i), *encodeJpeg(noisyPicture(side, side, 5U + i), 90));
-        }
-        rlimit before{};
-        ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &before), 0);
-        std::filesystem::remove_all(host(u"C:\\2000lumora"_s));
-        std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\2000lumora"_s));
-        makeFolder(u"C:\\2000lumora\\zmany"_s);
-        if (!disk.available()) {
-            std::signal(SIGXFSZ, SIG_IGN);
-            const rlimit limit{20000, before.rlim_max};
-            ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limit), 0);
-        }
-        const QStringList failed = prepare(pictures);
-        ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &before), 0);
-        ASSERT_FALSE(machine.dialogs.messages.isEmpty());
-        EXPECT_TRUE(machine.dialogs.messages[0].contains(u"2000lumora"_s)) << machine.dialogs.messages[0].toStdString();
-        const QStringList made = printFiles();
-        EXPECT_FALSE(made.isEmpty());
-        EXPECT_LT(made.size(), pictures.size());
-        EXPECT_EQ(made.size() + failed.size(), pictures.size()) << "each picture is printed or named as failed";
-        for (const QString& name : made)
-            EXPECT_TRUE(unpacked(name)) << name.toStdString();
-        for (const QString& path : pictures)
-            EXPECT_TRUE(machine.files.fileExists(DrivePath(path)));
     }
 
     DrivePath folder(const QString& number = u"105"_s) const {

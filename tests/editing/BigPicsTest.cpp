@@ -46,20 +46,6 @@ protected:
     const Bitmap picture = halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140));
 };
 
-TEST_F(WorkSurfaces, MeasureTheMiddleOfTheWorkPictureAndLeaveItAsItIs) {
-    BigPics surfaces;
-    surfaces.open(*EditedPreview::open(host(path), {10, 15}, 100, EditedPreview::Tone::Colour));
-    const QImage before = surfaces.workPicture()->workPicture().image().copy();
-    surfaces.Command2_Click();
-    EXPECT_EQ(surfaces.controls().Picture2.image().size(), QSize(400, 200));
-    EXPECT_EQ(surfaces.controls().Image_crop, QRect(50, 25, 300, 150));
-    EXPECT_EQ(surfaces.controls().List1.item(0), u"020"_s);
-    EXPECT_EQ(surfaces.controls().List3.item(surfaces.controls().List3.lastIndex()), u"140"_s);
-    EXPECT_NEAR(surfaces.controls().levels.gains[0], 255 / 220.2, 1e-4);
-    EXPECT_EQ(surfaces.controls().levels.floors, (ChannelValues{30, 50, 70}));
-    EXPECT_EQ(surfaces.workPicture()->workPicture().image(), before);
-}
-
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
     registerPage<Form3>(PageId::Form3);
     auto& look = chain.load<Form3>();

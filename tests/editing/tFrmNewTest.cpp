@@ -311,6 +311,7 @@ TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
     const QString measured = state.edit.EditState;
     auto& surfaces = chain.load<BigPics>();
     EXPECT_EQ(surfaces.controls().List1.count(), 61 * 46);
+    EXPECT_EQ(surfaces.controls().Image_crop, QRect(50, 37, 300, 225)) << "the middle";
     open(standing, measured);
     EXPECT_EQ(surfaces.controls().List1.count(), 61 * 81) << "measured anew";
 }

@@ -119,7 +119,7 @@ TEST(OrderTail, carriesTenDigitsOfALongTelephoneAndAsksForMore) {
         state.shemot.n2 = state.album.TelZalam = c.typed;
         for (const bool careful : {false, true}) {
             state.Careful = careful;
-            EXPECT_EQ(OrderTail::parse(OrderTail::of(state).shortForm())->telephone, careful ? c.careful : c.builtIn);
+            EXPECT_EQ(OrderTail::of(state).shortForm().mid(4, 10), (careful ? c.careful : c.builtIn).toLatin1());
             RecordedDialogs dialogs;
             EXPECT_EQ(TailTelephone(state).mayGoOnWith(c.typed, dialogs), !(careful && c.asks))
                 << c.typed.toStdString();

@@ -1,10 +1,16 @@
 #include "common/HostFile.h"
 #include "platform/ForwardCall.h"
+#include "platform/Instances.h"
 #include "platform/NetworkCards.h"
 #include "platform/QtEventPump.h"
 #include "platform/files/MarkedVolume.h"
 #include "platform/files/StatVolume.h"
+#include "platform/line/LineAbort.h"
 #include "support/DrivePathLiteral.h"
+
+#include <Poco/Net/NetException.h>
+#include <Poco/Net/ServerSocket.h>
+#include <Poco/Net/StreamSocket.h>
 
 #include <QCoreApplication>
 #include <QElapsedTimer>
@@ -13,7 +19,11 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <fstream>
+#include <optional>
+#include <string>
+#include <tuple>
 
 namespace lumora {
 namespace {
@@ -130,6 +140,63 @@ TEST(ForwardCalls, ReachTheRunOfTheSameFolderAsLongAsItLives) {
         EXPECT_EQ(called, 1);
     }
     EXPECT_FALSE(CallForward(toHostPath(folder.path())));
+}
+
+TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAsLongAsBothAreThere) {
+    const QTemporaryDir folder;
+    const QTemporaryDir elsewhere;
+    const Instances first(folder.path().toStdString());
+    const Instances stranger(elsewhere.path().toStdString());
+    EXPECT_FALSE(first.another());
+    std::optional<Instances> second(std::in_place, folder.path().toStdString());
+    EXPECT_TRUE(first.another());
+    EXPECT_TRUE(second->another());
+    EXPECT_FALSE(stranger.another());
+    second.reset();
+    EXPECT_FALSE(first.another());
+}
+
+TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
+    using Lock = Instances::Lock;
+    for (const auto& [first, second, refused] : {std::tuple{Lock::Exclusive, Lock::Exclusive, true},
+                                                 {Lock::Exclusive, Lock::Shared, true},
+                                                 {Lock::Shared, Lock::Exclusive, true},
+                                                 {Lock::Shared, Lock::Shared, false}}) {
+        const QTemporaryDir folder;
+        const QTemporaryDir elsewhere;
+        std::optional<Instances> one(std::in_place, folder.path().toStdString(), first);
+        EXPECT_FALSE(one->refused() || one->fault());
+        EXPECT_EQ(Instances(folder.path().toStdString(), second).refused(), refused);
+        EXPECT_FALSE(Instances(elsewhere.path().toStdString(), second).refused()) << "another data folder";
+        one.reset();
+        EXPECT_FALSE(Instances(folder.path().toStdString(), second).refused()) << "the first has ended";
+    }
+    const Instances none("/proc/no such folder", Lock::Exclusive);
+    EXPECT_FALSE(none.refused() || none.another());
+    EXPECT_TRUE(none.fault()->message.contains(u"No such file"_s));
+}
+
+// A server that reads the end of the data takes what came for the whole file.
+TEST(LineAbort, TheServerSeesAResetAndNoEndOfData) {
+    LineAbort line;
+    Poco::Net::ServerSocket listening(Poco::Net::SocketAddress("127.0.0.1", 0));
+    Poco::Net::StreamSocket client(listening.address());
+    Poco::Net::StreamSocket server = listening.acceptConnection();
+    server.setReceiveTimeout(Poco::Timespan(30, 0));
+    const LineAbort::Watch watch(line, client);
+    const std::string part(4000, 'x');
+    client.sendBytes(part.data(), static_cast<int>(part.size()));
+
+    line.abort();
+
+    std::array<char, 8192> bytes{};
+    EXPECT_THROW(
+        {
+            while (server.receiveBytes(bytes.data(), int(bytes.size())) > 0) {
+            }
+        },
+        Poco::Net::ConnectionResetException);
+    EXPECT_ANY_THROW(client.sendBytes(part.data(), static_cast<int>(part.size())));
 }
 
 } // namespace

@@ -59,16 +59,6 @@ TEST(ABasket, stopsItsSearchAtALineThatIsTooShort) {
     EXPECT_EQ(basket.FindByPath(u"C:\\b.jpg"_s), 1);
 }
 
-TEST(ABasket, holdsTheSumOfCopiesAtWhatAFieldOf16BitsTakes) {
-    Basket basket;
-    for (int i = 0; i < 400; ++i)
-        basket.append(plainLine(99, u"C:\\%1.jpg"_s.arg(i)));
-    EXPECT_EQ(basket.SumCopies(), 32767);
-    while (basket.count() > 2)
-        basket.removeAt(0);
-    EXPECT_EQ(basket.SumCopies(), 198);
-}
-
 TEST(ABasket, dropsLaterLinesThatDifferInTheirCopiesOnly) {
     Basket basket;
     for (const auto& [copies, name] : {std::pair{5, "a"}, {2, "b"}, {9, "a"}, {1, "a"}})

@@ -2,6 +2,7 @@
 
 #include "common/ListOutput.h"
 #include "editing/editor/gdisave.h"
+#include "support/FakeLab.h"
 #include "support/SendingRig.h"
 #include "transfer/ftp/FtpFrm.h"
 #include "transfer/report/InetForm.h"
@@ -81,6 +82,15 @@ struct FtpFrmRig : SendingRig {
         start();
         countDown();
     }
+};
+
+// The same over a lab in memory that has the folder of the orders.
+struct FtpFrmLine {
+    FtpFrmLine() { lab.folders[u"zalamim234"_s]; }
+    FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
+
+    FakeLab lab;
+    FtpFrmRig rig{lab};
 };
 
 } // namespace lumora

@@ -1,6 +1,5 @@
 #include "order/OrderFolder.h"
 #include "order/OrderState.h"
-#include "support/FakeLab.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/OrderFiles.h"
 
@@ -12,12 +11,7 @@ namespace lumora {
 
 namespace {
 
-// The sending page over a lab that has the folder of the orders.
-struct Line {
-    Line() { lab.folders[u"zalamim234"_s]; }
-
-    FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
-
+struct Line : FtpFrmLine {
     // Every file of the order lies on the server as it lies here, and nothing else does.
     void expectArrived() {
         const auto local = rig.localFiles();
@@ -27,9 +21,6 @@ struct Line {
         }
         EXPECT_EQ(remote().size(), FtpFrmRig::names().size());
     }
-
-    FakeLab lab;
-    FtpFrmRig rig{lab};
 };
 
 class FtpFrmTest : public ::testing::Test, protected Line {};

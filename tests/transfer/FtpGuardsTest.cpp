@@ -2,7 +2,6 @@
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
-#include "support/FakeLab.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/SilenceLimit.h"
 
@@ -14,11 +13,9 @@ namespace lumora {
 
 namespace {
 
-// The sending page with the guards on or off, over a lab that has the folder of the orders. The order's log names its
-// two pictures.
-struct Guarded {
+// The sending page with the guards on or off. The order's log names its two pictures.
+struct Guarded : FtpFrmLine {
     explicit Guarded(bool careful) {
-        lab.folders[u"zalamim234"_s];
         rig.state.Careful = careful;
         rig.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
         const QStringList items = {u"021015GNBC:\\pics\\aabb.jpg"_s, u"111015GNBC:\\pics\\aacc.jpg"_s};
@@ -36,10 +33,6 @@ struct Guarded {
         const Result<OrderState> state = ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()));
         return state ? *state : OrderState();
     }
-    FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
-
-    FakeLab lab;
-    FtpFrmRig rig{lab};
 };
 
 } // namespace

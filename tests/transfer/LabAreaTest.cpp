@@ -1,5 +1,4 @@
 #include "order/OrderJournal.h"
-#include "support/FakeLab.h"
 #include "support/FtpFrmRig.h"
 
 #include <gtest/gtest.h>
@@ -8,10 +7,8 @@ namespace lumora {
 
 namespace {
 
-// The sending page with its lab's own area, over a lab that has the folder of the orders; brought to a phase.
-struct Area {
-    Area() { lab.folders[u"zalamim234"_s]; }
-    FakeLab::Folder& remote() { return lab.folders[FtpFrmRig::remoteFolder()]; }
+// The sending page with its lab's own area, brought to a phase.
+struct Area : FtpFrmLine {
     FtpFrm& page() { return rig.page(); }
 
     void counts() { rig.start(); }
@@ -40,9 +37,6 @@ struct Area {
         sends();
     }
     void meetsAStranger() { remote()[u"stranger.jpp"_s] = "x", sends(); }
-
-    FakeLab lab;
-    FtpFrmRig rig{lab};
 };
 
 using Press = void (FtpFrm::*)();

@@ -445,7 +445,8 @@ TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesAndIsReportedOnceW
     rig.state.shemot.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
     rig.write(UploadFormRig::log(),
               OrderLog::of(rig.state, OrderLog::Layout::Plain, lines, {}, rig.test.clock.time).write());
-    rig.state.Careful = true;
+    rig.state.Careful = rig.state.transfer.leftOutAsked = true;
+    rig.state.transfer.leftOut = {{u"C:\\pics\\gone.jpg"_path}};
     rig.test.dialogs.answers = {true};
     EXPECT_EQ(rig.send().phase(), SendingPhase::AllThere);
     EXPECT_EQ(lab.uploads[UploadFormRig::name()], rig.localFiles());

@@ -12,7 +12,6 @@
 #include <QLineEdit>
 #include <QTest>
 #include <QTimer>
-#include <QWidget>
 
 #include <gtest/gtest.h>
 

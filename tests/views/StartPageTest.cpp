@@ -68,12 +68,23 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
         page.Timer2_Tick();
     look(walk, u"01-start-advert-closing"_s);
 
-    walk.press(u"hatchala"_s, u"Image1"_s);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
+    // The panel of the shops unfolds, closes in two ways and answers.
+    const auto unfold = [&] {
+        walk.press(u"hatchala"_s, u"Image1"_s);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
+        EXPECT_EQ(page.motion().Picture1Width(), StartMotion::panelWidth);
+    };
+    unfold();
     look(walk, u"01-start-shops"_s);
     walk.press(u"hatchala"_s, u"shopsBack"_s);
-    EXPECT_FALSE(page.controls().Picture1.visible);
     look(walk, u"01-start"_s);
+    unfold();
+    walk.key(Qt::Key_Escape);
+    EXPECT_FALSE(page.controls().Picture1.visible || walk.control(u"Picture1"_s).isVisible());
+    unfold();
+    walk.choose(u"hatchala"_s, u"List1"_s, page.controls().List1.item(1));
+    walk.waitFor(u"nnn"_s);
+    EXPECT_EQ(walk.program().state().KodMishloach, u"OSK");
 }
 
 TEST_P(StartLook, TheOfferOfAnOrderThatWasNotFinished) {
@@ -157,23 +168,6 @@ TEST(StartPage, ItsMotionsPaintNothingButThemselves) {
     EXPECT_GT(arrow.count, 3);
     EXPECT_EQ(words.count, 0);
     EXPECT_EQ(renderings, 0);
-}
-
-TEST(StartPage, ThePanelOfTheShopsUnfoldsAnswersAndCloses) {
-    Walk walk({1024, 768}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
-    hatchala& page = startPage(walk);
-    const auto unfold = [&] {
-        walk.press(u"hatchala"_s, u"Image1"_s);
-        EXPECT_TRUE(QTest::qWaitFor([&] { return !page.timers().Timer3.running(); }, 60000));
-    };
-    unfold();
-    EXPECT_EQ(page.motion().Picture1Width(), StartMotion::panelWidth);
-    walk.key(Qt::Key_Escape);
-    EXPECT_FALSE(walk.control(u"Picture1"_s).isVisible());
-    unfold();
-    walk.choose(u"hatchala"_s, u"List1"_s, page.controls().List1.item(1));
-    walk.waitFor(u"nnn"_s);
-    EXPECT_EQ(walk.program().state().KodMishloach, u"OSK");
 }
 
 } // namespace lumora

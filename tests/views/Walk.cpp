@@ -17,9 +17,7 @@
 #include <QAccessible>
 #include <QApplication>
 #include <QComboBox>
-#include <QCoreApplication>
 #include <QDir>
-#include <QElapsedTimer>
 #include <QFile>
 #include <QImage>
 #include <QLabel>

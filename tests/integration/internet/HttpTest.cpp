@@ -4,7 +4,6 @@
 #include "support/ScriptedServer.h"
 #include "support/TcpRelay.h"
 
-#include <QCoreApplication>
 #include <QElapsedTimer>
 #include <QFile>
 #include <QTemporaryDir>
