@@ -3,6 +3,7 @@
 #include "assembly/PaperResize.h"
 #include "common/HostFile.h"
 #include "editing/render/EditedPicture.h"
+#include "editing/render/PlainPrint.h"
 #include "imaging/PictureMemory.h"
 #include "imaging/files/PictureFile.h"
 #include "order/EditRecord.h"

@@ -38,6 +38,7 @@ public:
     static Result<EditedPreview> open(const std::filesystem::path& file, PaperSize paper, int zoomPercent, Tone tone,
                                       double largestScale = 1);
 
+    PictureSize fileSize() const { return m_file; } // of the picture itself
     PictureSize box() const { return m_box; }
     const Bitmap& workPicture() const { return m_work; }
 
@@ -78,7 +79,7 @@ private:
     const Bitmap& sourceFor(double scale) const { return scale > 1 && !m_sharp.isNull() ? m_sharp : m_work; }
     void prepareOverlay(const EditFields& edit, const std::optional<Bitmap>& frame, double scale);
 
-    PictureSize m_file; // the size of the picture itself
+    PictureSize m_file;
     PaperSize m_paper;
     PictureSize m_box;
     Bitmap m_work;

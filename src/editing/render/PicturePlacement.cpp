@@ -28,6 +28,11 @@ PaperOrientation orientationOf(PictureSize picture) {
     return picture.height < picture.width ? PaperOrientation::Landscape : PaperOrientation::Portrait;
 }
 
+QSize paperSides(PaperSize paper, PaperOrientation orientation) {
+    return orientation == PaperOrientation::Landscape ? QSize(paper.longSide, paper.shortSide)
+                                                      : QSize(paper.shortSide, paper.longSide);
+}
+
 PictureSize previewBox(PaperSize paper, PaperOrientation orientation) {
     if (orientation == PaperOrientation::Landscape)
         return {450, std::max(1, cut(450.0 * paper.shortSide / paper.longSide))};

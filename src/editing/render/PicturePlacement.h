@@ -4,6 +4,8 @@
 #include "imaging/drawing/PlacedDraw.h"
 #include "imaging/files/PictureFile.h"
 
+#include <QSize>
+
 #include <optional>
 
 namespace lumora {
@@ -18,6 +20,9 @@ enum class PaperOrientation { Landscape, Portrait };
 
 // A square picture counts as portrait.
 PaperOrientation orientationOf(PictureSize picture);
+
+// Width and height of the paper in centimetres, lying or upright.
+QSize paperSides(PaperSize paper, PaperOrientation orientation);
 
 // The box that stands for the paper: 450 wide in landscape, 300 wide in portrait. The two differ in size on purpose,
 // since positions in the record are in these pixels.
