@@ -72,6 +72,11 @@ void PictureChoice::readChosenPage() {
     turnTo(paths);
 }
 
+void PictureChoice::showAlone(const QStringList& paths) {
+    m_seen.stay();
+    turnTo(paths.first(std::min<qsizetype>(paths.size(), cellsOfPage)));
+}
+
 void PictureChoice::markPage() {
     m_copies.fill(0);
     for (int cell = 0; cell < m_page.count(); ++cell) {

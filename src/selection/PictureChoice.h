@@ -43,6 +43,8 @@ public:
     void previousPage();
     // A page of the basket's own pictures, from its reading position on.
     void chosenPage();
+    // A page of these pictures, or the first twelve of them; the page before it is the one in view.
+    void showAlone(const QStringList& paths);
     // The copies of the cells are read from the basket again.
     void markPage();
     // Takes what was chosen before, and the pictures that it was chosen from.

@@ -14,6 +14,11 @@ void SeenPages::seen(Page page) {
     m_pages.push_back(page);
 }
 
+void SeenPages::stay() {
+    if (m_state.Careful && !m_pages.empty())
+        m_pages.push_back(m_pages.back());
+}
+
 std::optional<SeenPages::Page> SeenPages::goBack(int lines) {
     if (!m_state.Careful || m_pages.empty())
         return std::nullopt;

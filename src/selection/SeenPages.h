@@ -24,6 +24,8 @@ public:
 
     void clear() { m_pages.clear(); }
     void seen(Page page);
+    // A page that is not remembered comes over the one in view.
+    void stay();
     // The page that was seen before the one in view; the first stays. No value as built in.
     std::optional<Page> goBack(int lines);
     bool hasNext(const FolderPager& folders) const;

@@ -132,6 +132,7 @@ TEST_F(ThePictures, ofAnEditedOrderKeepTheirEditsWhenTheyAreChosenAnew) {
     state.edit.EditState = record;
     state.edit.PicturePath = DrivePath(first);
     page.ZZvvA_Click();
+    EXPECT_EQ(page.controls().resolution[0].text, u"5 dpi"_s) << "at the zoom of the record";
     const QStringList lines = page.controls().List1.items();
     EXPECT_EQ(lines.first(), u"2 1015GNB"_s + record + first);
     const Result<QByteArray> all = machine.files.read(u"C:\\2000lumora\\Tik4txt\\all_list.txt"_path);
@@ -165,8 +166,13 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
     EXPECT_EQ(page.controls().Label6.text, u"  איכות נמוכה מאוד  30 / 40"_s);
     EXPECT_TRUE(page.controls().Picture2.poor);
     EXPECT_EQ(page.controls().Picture2.bitmap.width(), 400);
+    const auto paper = [&page] { return page.controls().Picture2.paper; };
+    EXPECT_NEAR(paper().height(), 8 / 9.0, 1e-9) << "10/15 is longer than the picture";
+    EXPECT_EQ(page.controls().resolution[0].text + page.controls().largeResolution.text,
+              u"6 dpi6 dpi בגודל 10/15: מפוקסלת"_s);
     for (const int width : {300, 400, 300, 400}) {
         page.Image4_Click();
+        EXPECT_NEAR(width == 300 ? paper().width() : paper().height(), 8 / 9.0, 1e-9) << "turned with the picture";
         EXPECT_EQ(page.controls().Picture2.bitmap.image().size(), QSize(width, 700 - width));
     }
     // At exactly 800000 pixels the text of the picture before stays, and no warning is painted.
@@ -175,6 +181,27 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
     EXPECT_EQ(page.controls().Label1.text, u"C:\\q\\01.jpg"_s);
     EXPECT_EQ(page.controls().Label6.text, u"  איכות נמוכה מאוד  30 / 40"_s);
     EXPECT_FALSE(page.controls().Picture2.poor);
+}
+
+TEST_F(ThePictures, thatWillPrintCoarseAreToldOfAndShownBeforeTheyAreSent) {
+    makePictures(u"C:\\q"_path, 1, {1600, 1100});
+    kyoskNew& page = openWith(14);
+    const kyoskNewControls& shown = page.controls();
+    page.Image16_Click();
+    page.Picture1_Click(1);
+    page.Picture1_Click(0);
+    pick(page, u"C:\\q\\01.jpg"_s);
+    page.Picture1_Click(1);
+    page.Image7_Click();
+    EXPECT_EQ(shown.coarseNote.text, u"2 תמונות יצאו מפוקסלות בגודל 10/15"_s);
+    page.showCoarse_Click();
+    EXPECT_FALSE(shown.Frame4.visible);
+    EXPECT_EQ(shown.List2.items(), QStringList({u"C:\\p\\14.jpg"_s, u"C:\\p\\13.jpg"_s}));
+    EXPECT_EQ(shown.Label2.text, u"C:\\p\\14.jpg"_s);
+    page.Command13_Click(0);
+    page.Command13_Click(1);
+    page.Image7_Click();
+    EXPECT_TRUE(shown.Frame4.visible && !shown.coarseNote.visible);
 }
 
 TEST_F(ThePictures, ofAWholeFolderAreSentOnRequestAndTakenBack) {
@@ -203,6 +230,7 @@ TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
     page.Image13_Click();
     EXPECT_EQ(machine.dialogs.messages, QStringList(u"לא נבחרו תמונות"_s));
     page.Command24_Click();
+    EXPECT_FALSE(page.controls().resolution[0].visible) << "the photographer lays out an album";
     EXPECT_TRUE(!page.controls().Image13.visible && page.controls().Image7.visible)
         << "there is always a way to finish";
     for (const bool deep : {false, true}) {

@@ -42,12 +42,13 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
     go(walk, toMenu + u"Image1(2) "_s + toOptions);
     const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;
     walk.choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex()));
-    go(walk, u"Option3(0) "_s + toTerms + u":23-fit Option5 "_s + toPictures);
+    go(walk, u"Option3(0) "_s + toTerms + u":23-fit Option4 "_s + toPictures);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
-    go(walk, u":23-whole-folder Command24"_s);
+    go(walk, u":23-whole-folder Command24 Picture1(2) :23-fitted"_s);
     walk.program().state().coupon.MisparKoopon = 14;
     walk.program().state().coupon.HaKoopon = 1;
-    go(walk, u"Image7 :24-panel-in-front Command21 :24-branches Command4Snif(10) :24-closing-coupon"_s);
+    go(walk, u"Image7 :24-panel-in-front Command21 :24-branches Command4Snif(10) :24-closing-coupon "
+             "showCoarse :24-coarse"_s);
 }
 
 TEST_P(PageLook, ThePreparationOfAnEditedOrder) {

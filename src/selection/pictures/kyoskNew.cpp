@@ -26,6 +26,7 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
     , m_platform(platform)
     , m_chain(chain)
     , m_choice(state)
+    , m_resolution(state, platform.files)
     , File1(platform.files, u"*.jpg"_s)
     , Timer1(40, [this] { moveLabel35(); })
     , Timer2(500, [this] { movePointers(); }) {}
@@ -47,6 +48,7 @@ void kyoskNew::load() {
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
     m_state.BranchChoice.clear();
     m_choice.setForm(lineFormOf(m_state.Optint));
+    decideCompression();
 
     // An album order has a finish of its own, until the whole folder is taken.
     Image13.visible = m_state.Optint == OrderKind::Album;
@@ -102,28 +104,39 @@ void kyoskNew::showChoice() {
     List4 = m_choice.folders().paths();
     Label7.text = QString::number(m_choice.basket().SumCopies());
     Image16.enabled = m_choice.hasNextPage();
-    for (int cell = 0; cell < cellsOfPage; ++cell) {
-        const auto at = static_cast<std::size_t>(cell);
-        const QString path = m_choice.path(cell);
-        const QString copies = QString::number(m_choice.copies(cell));
-        const QString name = LeafName(path);
-        const auto words = [&](const char16_t* hebrew, const char16_t* english) {
-            return m_state.wording(hebrew, english).arg(name);
-        };
-        Picture1[at].text = path;
-        Picture4[at].visible = m_choice.chosen(cell);
-        Label4[at].text = copies;
-        Label5[at].text = path.isEmpty() ? u"*"_s : RightPart(path, 20);
-        Picture1[at].spoken =
-            path.isEmpty() ? m_state.wording(u"תא ריק", u"Empty place")
-            : m_choice.chosen(cell)
-                ? m_state.wording(u"%1, נבחרה, עותקים: %2", u"%1, chosen, copies: %2").arg(name, copies)
-            : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
-                      : words(u"%1, לחץ לעריכה", u"%1, press to edit");
-        Command12[at].spoken = words(u"עותק נוסף של %1", u"One more copy of %1");
-        Command13[at].spoken = words(u"עותק אחד פחות של %1", u"One copy less of %1");
-    }
+    for (int cell = 0; cell < cellsOfPage; ++cell)
+        showCell(cell);
     Q_EMIT changed();
+}
+
+void kyoskNew::showCell(int cell) {
+    const auto at = static_cast<std::size_t>(cell);
+    const QString path = m_choice.path(cell);
+    const QString copies = QString::number(m_choice.copies(cell));
+    const QString name = LeafName(path);
+    const auto words = [&](const char16_t* hebrew, const char16_t* english) {
+        return m_state.wording(hebrew, english).arg(name);
+    };
+    const std::optional<PrintResolution> prints = m_resolution.of(path, m_choice.recordOf(path).value_or(QString()));
+    resolution[at].show(prints);
+    Picture1[at].text = path;
+    Picture4[at].visible = m_choice.chosen(cell);
+    Label4[at].text = copies;
+    Label5[at].text = path.isEmpty() ? u"*"_s : RightPart(path, 20);
+    Picture1[at].spoken = path.isEmpty() ? m_state.wording(u"תא ריק", u"Empty place")
+                          : m_choice.chosen(cell)
+                              ? m_state.wording(u"%1, נבחרה, עותקים: %2", u"%1, chosen, copies: %2").arg(name, copies)
+                          : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
+                                    : words(u"%1, לחץ לעריכה", u"%1, press to edit");
+    if (prints)
+        Picture1[at].spoken += u", "_s + prints->text() + u": "_s + prints->word(m_state.english());
+    Command12[at].spoken = words(u"עותק נוסף של %1", u"One more copy of %1");
+    Command13[at].spoken = words(u"עותק אחד פחות של %1", u"One copy less of %1");
+}
+
+void kyoskNew::takeInHand(const QString& path) {
+    m_largePath = DrivePath(path);
+    Label1.text = Label2.text = path;
 }
 
 void kyoskNew::setScreenHeight(int pixels) {

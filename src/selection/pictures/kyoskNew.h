@@ -3,6 +3,7 @@
 #include "order/MailAddressGuard.h"
 #include "platform/files/Files.h"
 #include "selection/FinishRule.h"
+#include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
 #include "selection/pictures/kyoskNewControls.h"
@@ -91,6 +92,7 @@ public:
     void Command8_Click() { goOnWithAddress(); }
     void Command7_Click() { goOnWithoutAddress(); }
     void Command10_Click() { closeFinish(); }
+    void showCoarse_Click() { showCoarsePictures(); }
 
     // What no view offers.
     void Image23_Click() { endProgram(); }
@@ -122,6 +124,8 @@ private:
     void say(const char16_t* hebrew, const char16_t* english);
     void takeBack(const QStringList& basket, const QStringList& pictures);
     void showChoice();
+    void showCell(int cell);
+    void takeInHand(const QString& path);
     void askToLeave();
     void endProgram();
     void stay();
@@ -141,6 +145,7 @@ private:
     HostPath hostOf(const DrivePath& path) const;
     DrivePath pictureToDraw(const QString& path) const;
     void showLarge(const DrivePath& path);
+    void showPaper();
     void showGuide(Guide guide);
     void turnLargeView();
     void lookInLarge();
@@ -171,7 +176,10 @@ private:
     void finishAlbum();
     void checkAndClose();
     bool couponRefuses();
+    DeepCompression decideCompression();
     void openClosingPanel();
+    void countCoarse();
+    void showCoarsePictures();
     void closeFinish();
     void openBranches();
     void offerBranches();
@@ -192,11 +200,14 @@ private:
 
     void setBrowserTexts();
     void setClosingTexts();
+    void setPaperTexts();
+    void setCoarseTexts();
 
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
     PictureChoice m_choice;
+    OrderResolution m_resolution;
     FileList File1;
     Ticker Timer1;
     Ticker Timer2;
@@ -214,6 +225,8 @@ private:
     Guide m_guide = Guide::None;
     PrintGrade m_grade = PrintGrade::Unmarked; // what Label6 tells, and of which size
     PictureSize m_gradedSize;
+    PictureSize m_largeSize; // of the picture in the large view
+    QStringList m_coarse;    // the paths that the closing panel tells of
     QString m_focusBox;
     int m_focusRequest = 0;
 };

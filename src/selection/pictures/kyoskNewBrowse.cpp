@@ -173,6 +173,8 @@ void kyoskNew::drawCells() {
             Result<Bitmap>& picture = pictures[static_cast<std::size_t>(cell - first)];
             shown.bitmap = picture ? std::move(*picture) : Bitmap();
             shown.visible = true;
+            m_resolution.look(m_choice.path(cell));
+            showCell(cell);
         }
         Q_EMIT changed();
         m_platform.pump.pump();
@@ -212,6 +214,9 @@ void kyoskNew::showLarge(const DrivePath& path) {
     Picture2.text.clear();
     Picture2.guide.clear();
 
+    m_largeSize = *size;
+    showPaper();
+
     const PrintGrade grade = printGrade(*size);
     Picture2.poor = grade == PrintGrade::Borderline || grade == PrintGrade::VeryLow;
     if (grade != PrintGrade::Unmarked) {
@@ -219,6 +224,15 @@ void kyoskNew::showLarge(const DrivePath& path) {
         m_gradedSize = *size;
         Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
     }
+}
+
+// The paper turns with the view, and so does not depend on it.
+void kyoskNew::showPaper() {
+    const std::optional<PaperSize> paper = Picture2.bitmap.isNull() ? std::nullopt : m_resolution.paper();
+    Picture2.paper = paper ? paperOnPicture(m_largeSize, *paper, m_resolution.fit()) : QRectF();
+    if (m_rotation % 180 != 0)
+        Picture2.paper = {Picture2.paper.topLeft().transposed(), Picture2.paper.size().transposed()};
+    setPaperTexts();
 }
 
 void kyoskNew::turnLargeView() {

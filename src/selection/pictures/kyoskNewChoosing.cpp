@@ -24,8 +24,7 @@ void kyoskNew::choosePicture(int cell) {
         takeIntoEditor(path);
         m_choice.choose(cell, m_state.edit.EditState);
     }
-    m_largePath = DrivePath(path);
-    Label1.text = Label2.text = path;
+    takeInHand(path);
     showChoice();
     if (plain())
         return;

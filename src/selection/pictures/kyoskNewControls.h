@@ -1,9 +1,12 @@
 #pragma once
 
+#include "editing/ResolutionCaption.h"
 #include "imaging/Bitmap.h"
 #include "selection/FolderPager.h"
 #include "session/Caption.h"
 #include "session/TextList.h"
+
+#include <QRectF>
 
 namespace lumora {
 
@@ -26,6 +29,7 @@ struct LargeView : SpokenCaption {
     Bitmap bitmap;
     bool poor = false; // the picture has few pixels: the warning is painted over it
     QString warning;
+    QRectF paper; // over the picture, in shares of its sides as they are shown; null where no paper is drawn
     QStringList guide;
 };
 
@@ -39,6 +43,7 @@ struct kyoskNewControls : Controls {
     ControlArray<Caption, cellsOfPage> Picture4{*this, u"Picture4"}; // the chosen mark; plus and minus lie in it
     ControlArray<Caption, cellsOfPage> Label4{*this, u"Label4"};     // copies
     ControlArray<Caption, cellsOfPage> Label5{*this, u"Label5"};     // end of the path, "*" when empty
+    ControlArray<ResolutionCaption, cellsOfPage> resolution{*this, u"resolution", Caption::At::Hidden};
     ControlArray<SpokenCaption, cellsOfPage> Command12{*this, u"Command12"}; // plus
     ControlArray<SpokenCaption, cellsOfPage> Command13{*this, u"Command13"}; // minus
 
@@ -48,7 +53,9 @@ struct kyoskNewControls : Controls {
     Caption Label1{*this, u"Label1"}; // the path of the picture in hand, or the number of lines after Command11
     Caption Label2{*this, u"Label2"}; // the path that Image4 turns
     Caption Label6{*this, u"Label6"}; // the grade
-    Caption Label7{*this, u"Label7"}; // copies in all
+    ResolutionCaption largeResolution{*this, u"largeResolution", Caption::At::Hidden};
+    Caption paperNote{*this, u"paperNote", Caption::At::Hidden}; // what becomes of the picture on its paper
+    Caption Label7{*this, u"Label7"};                            // copies in all
     Caption Label7Prompt{*this, u"Label7Prompt"};
     Caption Label15{*this, u"Label15"}; // paper size
     Caption Label18{*this, u"Label18"};
@@ -107,10 +114,12 @@ struct kyoskNewControls : Controls {
     Caption Label20{*this, u"Label20"}; // copies
     Caption Label19Prompt{*this, u"Label19Prompt"};
     Caption Label20Prompt{*this, u"Label20Prompt"};
-    Caption Label17{*this, u"Label17"};     // prompt of the address
-    Caption Label33{*this, u"Label33"};     // the address is required
-    Caption Text1{*this, u"Text1"};         // the address before its "@"
-    SpokenCaption Combo1{*this, u"Combo1"}; // and behind it, as chosen or typed
+    Caption coarseNote{*this, u"coarseNote", Caption::At::Hidden}; // how many pictures will print coarse
+    Caption showCoarse{*this, u"showCoarse", Caption::At::Hidden}; // leads to them
+    Caption Label17{*this, u"Label17"};                            // prompt of the address
+    Caption Label33{*this, u"Label33"};                            // the address is required
+    Caption Text1{*this, u"Text1"};                                // the address before its "@"
+    SpokenCaption Combo1{*this, u"Combo1"};                        // and behind it, as chosen or typed
     QStringList Combo1Items;
     int Combo1Index = -1;
     Caption Txt4Ml2{*this, u"Txt4Ml2"}; // the whole address of an album order

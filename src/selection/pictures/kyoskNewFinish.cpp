@@ -41,13 +41,18 @@ void kyoskNew::checkAndClose() {
     }
     if (couponRefuses())
         return;
+    const DeepCompression deep = decideCompression();
+    openClosingPanel();
+    // The question is shown only together with the closing panel below it.
+    Picture7.visible = PicB4Sioom.visible && deep == DeepCompression::Ask;
+}
+
+DeepCompression kyoskNew::decideCompression() {
     const bool mayBeDeep = plain() && (m_state.Optint != OrderKind::Album || m_state.DchisatAlbum);
     const DeepCompression deep =
         mayBeDeep ? deepCompression(m_state.shemot.ppr, m_state.MediniyutDchisa) : DeepCompression::Off;
     m_state.DchisaAmoka = deep == DeepCompression::On ? 1 : 0;
-    openClosingPanel();
-    // The question is shown only together with the closing panel below it.
-    Picture7.visible = PicB4Sioom.visible && deep == DeepCompression::Ask;
+    return deep;
 }
 
 bool kyoskNew::couponRefuses() {
@@ -81,6 +86,26 @@ void kyoskNew::openClosingPanel() {
     Label20.text = QString::number(m_choice.basket().SumCopies());
     if (m_state.Optint == OrderKind::Album)
         Txt4Ml2.text = m_state.album.MailZalam;
+    countCoarse();
+    Q_EMIT changed();
+}
+
+void kyoskNew::countCoarse() {
+    m_coarse = m_resolution.coarse(m_choice.basket());
+    coarseNote.visible = showCoarse.visible = !m_coarse.isEmpty();
+    setCoarseTexts();
+}
+
+void kyoskNew::showCoarsePictures() {
+    closeFinish();
+    turnPage([this] {
+        m_choice.showAlone(m_coarse);
+        drawPage();
+    });
+    if (!plain() || m_coarse.isEmpty())
+        return;
+    showLarge(DrivePath(m_coarse.first()));
+    takeInHand(m_coarse.first());
     Q_EMIT changed();
 }
 
@@ -94,7 +119,9 @@ void kyoskNew::closeFinish() {
 void kyoskNew::setDeepCompression(bool deep) {
     m_state.DchisaAmoka = deep ? 1 : 0;
     Picture7.visible = false;
-    Q_EMIT changed();
+    countCoarse();
+    showPaper();
+    showChoice();
 }
 
 // Does not signal: the caller signals once for both panels.

@@ -4,6 +4,9 @@
 #include "session/SessionState.h"
 #include "session/lab/MailDomains.h"
 
+#include <algorithm>
+#include <cmath>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -14,6 +17,7 @@ void kyoskNew::setTexts() {
     showGuide(m_guide);
     if (m_grade != PrintGrade::Unmarked)
         Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
+    setPaperTexts();
     if (m_countShown)
         showPictureCount();
     showChoice();
@@ -80,6 +84,12 @@ void kyoskNew::setBrowserTexts() {
                                   u"תמונה של פחות ממיליון פיקסלים מציגה אזהרה על איכות נמוכה",
                                   u"Plus and minus set the number of copies\n"
                                   u"A picture of under a million pixels shows a warning of low quality");
+    if (m_resolution.paper())
+        Label9.text +=
+            m_state.wording(u"\nהסימן שעל תמונה אומר כמה נקודות לאינץ' יהיו לה על הנייר שנבחר:\n"
+                            u"מ-200 dpi היא חדה, מ-120 dpi סבירה, ומתחת לכך מפוקסלת",
+                            u"\nThe mark on a picture tells its dots per inch on the paper that was chosen:\n"
+                            u"from 200 dpi on it is sharp, from 120 dpi on fair, and below that coarse");
 
     const QString once = m_state.wording(u"יש לבחור רק תמונה אחת", u"Select one image only");
     const QString all =
@@ -119,6 +129,7 @@ void kyoskNew::setClosingTexts() {
             {LblKoopon, u" אם יש ברשותך מנוי או קופון הנחה \r\n רצוי שתרשום את מספרו \r\n בחלונית ההערות ",
              u" If you hold a subscription or a discount coupon \r\n please write its number \r\n in the notes box "},
             {Label4kpn3Prompt, u"תמונות בקופון", u"Pictures in the coupon"},
+            {showCoarse, u"הצג אותן", u"Show them"},
             {Command8, u"המשך", u"Continue"},
             {Command10, u"חזור לדף בחירת תמונות ", u"Back to the pictures"},
             {Pic4snifim, u"בחר סניף שבו תרצה לקבל את התמונות", u"Choose the branch where you want to get the pictures"},
@@ -130,6 +141,7 @@ void kyoskNew::setClosingTexts() {
             {Command20, u"לא להעמיק דחיסה", u"Do not compress deeper"},
             {Command21, u"כן להעמיק דחיסה", u"Compress deeper"},
         });
+    setCoarseTexts();
     Combo1.spoken = m_state.wording(u"ספק הדואר, אחרי השטרודל", u"Mail provider, behind the at sign");
     if (m_promptStands)
         Combo1.text = mailDomainPrompt(m_state.english());
@@ -168,6 +180,35 @@ void kyoskNew::showGuide(Guide guide) {
     Picture2.bitmap = Bitmap();
     Picture2.poor = false;
     Image4.visible = false;
+    showPaper();
+}
+
+void kyoskNew::setPaperTexts() {
+    // A paper that differs from the picture by less than this share cuts nothing that is seen.
+    constexpr double unseen = 0.005;
+    const QRectF& paper = Picture2.paper;
+    paperNote.visible = !paper.isNull();
+    largeResolution.show(paper.isNull() ? std::nullopt : m_resolution.of(m_largeSize, {}), m_state.shemot.ppr,
+                         m_state.english());
+    if (std::max(std::abs(paper.width() - 1), std::abs(paper.height() - 1)) < unseen)
+        setCaptions(m_state,
+                    {{paperNote, u"תודפס כולה (בערך, המעבדה חותכת)", u"All of it prints (about, the lab cuts)"}});
+    else if (m_resolution.fit() == PaperFit::Fill)
+        setCaptions(m_state,
+                    {{paperNote, u"הכהה ייחתך (בערך, המעבדה חותכת)", u"Shaded: cut off (about, the lab cuts)"}});
+    else
+        setCaptions(m_state, {{paperNote, u"השוליים יישארו לבנים (בערך, המעבדה חותכת)",
+                               u"White: stays empty (about, the lab cuts)"}});
+}
+
+void kyoskNew::setCoarseTexts() {
+    const QString& paper = m_state.shemot.ppr;
+    coarseNote.text =
+        m_coarse.size() == 1
+            ? m_state.wording(u"תמונה אחת תצא מפוקסלת בגודל %1", u"1 picture will look coarse at %1").arg(paper)
+            : m_state.wording(u"%1 תמונות יצאו מפוקסלות בגודל %2", u"%1 pictures will look coarse at %2")
+                  .arg(m_coarse.size())
+                  .arg(paper);
 }
 
 } // namespace lumora

@@ -178,11 +178,12 @@ QString atLineStart(const QString& text, bool english) {
 }
 
 QString isolated(const QString& text) {
-    // Paths, addresses of the web and of mail, names of files, sizes, "3 / 12", percentages, telephone numbers.
+    // Paths, addresses of the web and of mail, names of files, sizes, "3 / 12", percentages, resolutions, telephone
+    // numbers.
     static const QRegularExpression ownDirection(
         u"[A-Za-z]:\\\\[^\\n]*|(?<!\\S)/[^/\\n]+/[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+"
         "|(?<!\\S)[!-~]+\\.[A-Za-z]{3}(?![\\w.])"
-        "|\\d+(?:\\s*[/x,_-]\\s*\\d+|[:.]\\d+)+(?:\\s?%)?|\\d+\\s?%|\\+\\d+"_s);
+        "|\\d+(?:\\s*[/x,_-]\\s*\\d+|[:.]\\d+)+(?:\\s?%)?|\\d+\\s?%|\\d+ dpi|\\+\\d+"_s);
     QString result = text;
     result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     // Qt draws a right-to-left line that ends with a blank that much too far to the right, and the label cuts it.

@@ -4,12 +4,23 @@
 
 #include <QKeyEvent>
 #include <QMouseEvent>
+#include <QPainterPath>
 
 #include <utility>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+// The paper where the picture has that place on the screen.
+QRectF paperOver(const QRectF& picture, const QRectF& shares) {
+    return {picture.left() + shares.left() * picture.width(), picture.top() + shares.top() * picture.height(),
+            shares.width() * picture.width(), shares.height() * picture.height()};
+}
+
+} // namespace
 
 LargePicture::LargePicture(const Theme& theme, QWidget* parent)
     : QWidget(parent)
@@ -43,6 +54,39 @@ void LargePicture::keyPressEvent(QKeyEvent* event) {
     Q_EMIT clicked();
 }
 
+// The picture and its paper together are as large as the view.
+QRectF LargePicture::pictureRoom() const {
+    const QRectF one(0, 0, 1, 1);
+    const QRectF both = m_view.paper.isNull() ? one : one.united(m_view.paper);
+    const QSizeF shape = m_view.bitmap.image().size();
+    const QRectF room = fitted(rect(), {shape.width() * both.width(), shape.height() * both.height()});
+    const QSizeF size(room.width() / both.width(), room.height() / both.height());
+    return {{room.left() - both.left() * size.width(), room.top() - both.top() * size.height()}, size};
+}
+
+// What the paper does not take is shaded, and the paper's edge is seen on any picture.
+void LargePicture::drawCut(QPainter& painter, const QRectF& picture) const {
+    const QRectF paper = paperOver(picture, m_view.paper);
+    QPainterPath cut;
+    cut.addRect(picture);
+    QPainterPath kept;
+    kept.addRect(paper);
+    cut -= kept;
+    QColor shade = Theme::Colour::Ink;
+    shade.setAlpha(165);
+    painter.fillPath(cut, shade);
+    painter.fillPath(cut, QBrush(QColor(255, 255, 255, 70), Qt::BDiagPattern));
+    painter.setBrush(Qt::NoBrush);
+    const double half = m_theme.hair() / 2.0;
+    const QRectF edge = paper.adjusted(half, half, -half, -half);
+    painter.setPen(QPen(Theme::Colour::Ink, m_theme.hair()));
+    painter.drawRect(edge);
+    QPen dashes(Qt::white, m_theme.hair());
+    dashes.setDashPattern({4, 4});
+    painter.setPen(dashes);
+    painter.drawRect(edge);
+}
+
 void LargePicture::paintEvent(QPaintEvent*) {
     if (!m_view.visible)
         return;
@@ -72,9 +116,11 @@ void LargePicture::paintEvent(QPaintEvent*) {
         painter.drawText(words, flags, lines.join(u'\n'));
         return;
     }
-    const QImage& picture = m_view.bitmap.image();
-    const QRectF at = fitted(rect(), picture.size());
-    painter.drawImage(at, picture);
+    const QRectF at = pictureRoom();
+    painter.fillRect(paperOver(at, m_view.paper), Qt::white);
+    painter.drawImage(at, m_view.bitmap.image());
+    if (!m_view.paper.isNull())
+        drawCut(painter, at);
     const double radius = m_theme.size(Space::Wide);
     const double in = radius + m_theme.size(Space::Small);
     const QPointF plate(at.right() - in, at.bottom() - in);

@@ -7,8 +7,8 @@
 
 namespace lumora {
 
-// The large view of the picture page: the picture with the warning of low quality, or lines of guidance. A picture can
-// be pressed.
+// The large view of the picture page: the picture on its paper with the warning of low quality, or lines of guidance. A
+// picture can be pressed.
 class LargePicture : public QWidget {
     Q_OBJECT
 public:
@@ -25,6 +25,9 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
+    QRectF pictureRoom() const;
+    void drawCut(QPainter& painter, const QRectF& picture) const;
+
     const Theme& m_theme;
     LargeView m_view;
     bool m_pressed = false;

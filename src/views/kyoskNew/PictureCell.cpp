@@ -1,8 +1,11 @@
 #include "views/kyoskNew/PictureCell.h"
 
 #include "views/kit/Maker.h"
+#include "views/picture/ResolutionBadge.h"
 
 #include <QKeyEvent>
+
+#include <algorithm>
 
 namespace lumora {
 
@@ -101,6 +104,7 @@ void PictureCell::paintEvent(QPaintEvent*) {
     if (!m_look.filled)
         return;
     const QRect room = pictureRoom();
+    QPointF mark = room.bottomLeft();
     if (!m_look.picture.isNull()) {
         const double ratio = devicePixelRatioF();
         QSizeF size = QSizeF(m_look.picture.size()) / ratio;
@@ -112,10 +116,15 @@ void PictureCell::paintEvent(QPaintEvent*) {
         at.moveTopLeft(QPointF(at.topLeft().toPoint()));
         painter.fillRect(at.translated(theme().hair(), theme().hair()), QColor(0, 0, 0, 30));
         painter.drawImage(at, m_look.picture);
+        mark = at.bottomLeft() + QPointF(-theme().px(6), theme().px(12));
     } else {
         drawIcon(painter, QRectF(room).center(),
                  theme().icon(u"picture"_s, theme().size(IconSize::Box), Theme::Colour::Edge));
     }
+    if (m_look.resolution.visible)
+        drawResolution(painter, theme(),
+                       {std::max<double>(mark.x(), room.left()), std::min<double>(mark.y(), room.bottom())},
+                       m_look.resolution);
     if (m_look.chosen || m_look.inEditor)
         drawMark(painter, theme(), card,
                  {.icon = m_look.inEditor ? u"edit"_s : u"tick"_s,

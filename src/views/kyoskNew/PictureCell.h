@@ -1,5 +1,6 @@
 #pragma once
 
+#include "editing/ResolutionCaption.h"
 #include "views/kit/Cards.h"
 
 class QLabel;
@@ -21,6 +22,7 @@ public:
         bool inEditor = false;
         QString copies;
         QString name;
+        ResolutionCaption resolution;
     };
     void show(const Look& look);
 

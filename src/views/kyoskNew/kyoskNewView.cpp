@@ -5,6 +5,7 @@
 #include "views/kit/Overlay.h"
 #include "views/kyoskNew/LargePicture.h"
 #include "views/kyoskNew/PictureCell.h"
+#include "views/picture/ResolutionBadge.h"
 
 #include <QApplication>
 #include <QKeyEvent>
@@ -22,6 +23,11 @@ namespace {
 
 // Four in a row, so that the large picture stands beside them.
 constexpr int columns = 4;
+
+// The two sides of a picture stay in one line.
+QString unbrokenSize(const QString& text) {
+    return isolated(text).replace(u" / "_s, u"\u00A0/\u00A0"_s);
+}
 
 // A long text stands in two lines, broken at the blank nearest to its middle.
 void breakLong(QPushButton& button) {
@@ -128,7 +134,12 @@ QWidget* kyoskNewView::makeSide() {
     connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
     const Card picture = makeCard("card", Pad::Slim);
     QPushButton* turn = button(c.Image4, Role::Plain, &kyoskNew::Image4_Click, u"rotate"_s);
-    add(*picture.column, {{m_large, 1}, centred(label(c.Label6, "strong")), {turn, 0, Qt::AlignCenter}});
+    m_largeResolution = new ResolutionBadge(theme(), this);
+    bind(m_largeResolution, c.largeResolution);
+    add(*picture.column, {{m_large, 1},
+                          centred(label(c.paperNote, "smallMuted")),
+                          {m_largeResolution, 0, Qt::AlignCenter},
+                          inRow(Space::Small, {{centred(label(c.Label6, "strong", unbrokenSize)), 1}, turn})});
 
     m_offerButtons = {
         button(c.Command24, Role::Plain, &kyoskNew::Command24_Click),
@@ -189,9 +200,15 @@ void kyoskNewView::makeClosingPanel() {
     facts.column->addLayout(
         inRow(Space::Small, {lineLabel(c.Label20Prompt, "muted"), lineLabel(c.Label20, "title"), Item::room(),
                              lineLabel(c.Label19Prompt, "muted"), lineLabel(c.Label19, "title"), Item::room()}));
+    const Card coarse = makeCard("notice", Pad::Slim);
+    coarse.column->addLayout(
+        inRow(Space::Normal, {sign(u"warning"_s, IconSize::Line, Theme::Colour::Danger),
+                              {label(c.coarseNote, "strong"), 1},
+                              button(c.showCoarse, Role::Plain, &kyoskNew::showCoarse_Click, u"pictures"_s)}));
+    follow(coarse.frame, c.coarseNote);
     m_closing = new Overlay(
         theme(), this,
-        {inRow(Space::Normal, {{label(c.closingHead, "title"), 1}, prices}), facts.frame,
+        {inRow(Space::Normal, {{label(c.closingHead, "title"), 1}, prices}), facts.frame, coarse.frame,
          inRow(Space::Small, {lineLabel(c.Label4kpn3Prompt, "muted"), lineLabel(c.Label4kpn3, "strong"), Item::room()}),
          inRow(Space::Small, {label(c.Label17, "strong"), lineLabel(c.Label33, "danger"), Item::room()}),
          // An address runs from left to right in both languages.
@@ -275,6 +292,7 @@ void kyoskNewView::renderCells() {
         look.inEditor = m_page.openCell() == static_cast<int>(i);
         look.copies = c.Label4[i].text;
         look.name = LeafName(cell.text);
+        look.resolution = c.resolution[i];
         m_cells[i]->show(look);
         speak(m_cells[i], cell.spoken);
         speak(m_cells[i]->plus(), c.Command12[i].spoken);
@@ -328,6 +346,7 @@ void kyoskNewView::render() {
     renderFolder();
     renderCells();
     m_large->show(c.Picture2);
+    m_largeResolution->display(c.largeResolution);
     setDirectedIcon(m_previous, Way::Back);
     setDirectedIcon(m_next, Way::Forwards);
     m_next->setLayoutDirection(state().english() ? Qt::RightToLeft : Qt::LeftToRight);

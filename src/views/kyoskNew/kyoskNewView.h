@@ -10,6 +10,7 @@ namespace lumora {
 class EditableCombo;
 class LargePicture;
 class PictureCell;
+class ResolutionBadge;
 
 class kyoskNewView : public ViewOf<kyoskNew> {
     Q_OBJECT
@@ -44,6 +45,7 @@ private:
     QStackedLayout* m_body = nullptr;
     std::array<PictureCell*, cellsOfPage> m_cells{};
     LargePicture* m_large = nullptr;
+    ResolutionBadge* m_largeResolution = nullptr;
     QWidget* m_side = nullptr;
     std::array<QPushButton*, 3> m_offerButtons{};
     QLabel* m_folder = nullptr;
