@@ -35,6 +35,7 @@ TEST_F(TheEditor, packsAndStoresEachControlInItsOwnWay) {
     editor.Timer2_Tick();
     EXPECT_EQ(state.edit.ZoomPercent, 104);
     EXPECT_EQ(shown().Label11.text, u"104"_s);
+    EXPECT_EQ(shown().resolution.text, u"65 dpi בגודל 10/15: מפוקסלת"_s);
     EXPECT_EQ(field(EditRecord::ZoomPercent), u"100"_s);
     EXPECT_TRUE(stored.isEmpty());
     editor.Image2_MouseUp(0);

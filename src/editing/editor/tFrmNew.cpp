@@ -302,6 +302,15 @@ void tFrmNew::undoAllEdits() {
 void tFrmNew::showNumbers() {
     Label10.text = QString::number(m_edit.RotationCode);
     Label11.text = QString::number(PreviewZoom);
+    showResolution();
+}
+
+void tFrmNew::showResolution() {
+    const QString& paper = m_state.shemot.ppr;
+    const std::optional<PaperSize> size = m_open ? PaperSize::ofText(paper) : std::nullopt;
+    resolution.show(size ? std::optional(PrintResolution::ofEdited(workPicture()->fileSize(), *size, m_edit))
+                         : std::nullopt,
+                    paper, m_state.english());
 }
 
 // RotationCode is 180 for an upright picture.

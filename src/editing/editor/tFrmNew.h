@@ -272,6 +272,7 @@ private:
     void packRenderStore(); // the two patterns that most controls follow
     void renderPackStore();
     void showNumbers();
+    void showResolution();
 
     const SessionState& m_state;
     EditFields& m_edit;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "editing/ResolutionCaption.h"
 #include "editing/render/CropFrame.h"
 #include "editing/render/LineFramePalette.h"
 #include "editing/render/TextLabelPlace.h"
@@ -17,13 +18,14 @@ struct tFrmNewControls : Controls {
     Caption Labeltext{*this, u"Labeltext", Caption::At::Hidden}; // blanks, as long as the caption
     TextLabelBox LabeltextBox;                                   // the box that marks the caption
 
-    Caption Label10{*this, u"Label10"}; // the turn
-    Caption Label11{*this, u"Label11"}; // the zoom
-    Caption Label13{*this, u"Label13"}; // the record, for the operator
-    Caption Label5{*this, u"Label5"};   // how many frames the category has
-    Caption Label6{*this, u"Label6"};   // the frame in hand, "3  / "
-    Caption Label4{*this, u"Label4"};   // the palette's index
-    int VScrollZ = 100;                 // VScrollZMin to VScrollZMax
+    Caption Label10{*this, u"Label10"};                                      // the turn
+    Caption Label11{*this, u"Label11"};                                      // the zoom
+    Caption Label13{*this, u"Label13"};                                      // the record, for the operator
+    Caption Label5{*this, u"Label5"};                                        // how many frames the category has
+    Caption Label6{*this, u"Label6"};                                        // the frame in hand, "3  / "
+    Caption Label4{*this, u"Label4"};                                        // the palette's index
+    ResolutionCaption resolution{*this, u"resolution", Caption::At::Hidden}; // at which the open picture prints
+    int VScrollZ = 100;                                                      // VScrollZMin to VScrollZMax
     static constexpr int VScrollZMin = 40;
     static constexpr int VScrollZMax = 210;
 

@@ -87,6 +87,7 @@ void tFrmNew::setTexts() {
     for (Caption* held : {&Image2[0], &Image2[1], &Image2[3], &Image2[4], &Image135, &Image115, &Image125, &Image145,
                           &Image16, &Image17})
         held->hint += m_state.wording(u"= לחיצה ממושכת על העכבר = ", u"= long press of the mouse = ");
+    showResolution();
     Q_EMIT changed();
 }
 

@@ -5,6 +5,7 @@
 #include "session/PageChain.h"
 #include "views/kit/Overlay.h"
 #include "views/kit/ToolButton.h"
+#include "views/picture/ResolutionBadge.h"
 #include "views/tFrmNew/EditorPaper.h"
 #include "views/tFrmNew/FilmStrip.h"
 #include "views/tFrmNew/FrameThumbs.h"
@@ -222,7 +223,9 @@ void tFrmNewView::makeBars() {
     frame().addHeaderAction(m_help);
     m_name = oneLine("muted");
     bindName(m_name, c.Title);
-    frame().addStatus(m_name);
+    m_resolution = new ResolutionBadge(theme(), this);
+    bind(m_resolution, c.resolution);
+    frame().addStatus({m_name, Space::Normal, m_resolution});
     m_done = button(c.CommandDone, Role::Main, &tFrmNew::CommandDone_Click);
     frame().addMainAction(m_done);
 }
@@ -286,6 +289,7 @@ void tFrmNewView::render() {
     m_undo->setVisible(c.Picture3.visible);
     m_name->setText(fromLeft(m_name->fontMetrics().elidedText(c.Title.text, Qt::ElideMiddle, theme().px(260))));
     m_operator->setVisible(state().DegelEdit);
+    m_resolution->display(c.resolution);
     m_table->render(c.Image19.visible ? c.Image19.text : QString());
     placePanels();
 }

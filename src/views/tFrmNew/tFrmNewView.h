@@ -14,6 +14,7 @@ class EditorTable;
 class FrameThumbs;
 class kyoskNew;
 class PageChain;
+class ResolutionBadge;
 class StripCell;
 class ToolButton;
 
@@ -80,6 +81,7 @@ private:
     QLabel* m_position = nullptr;
     QLabel* m_angle = nullptr;
     QLabel* m_name = nullptr;
+    ResolutionBadge* m_resolution = nullptr;
     QComboBox* m_categories = nullptr;
     QComboBox* m_lineStyles = nullptr;
     FrameThumbs* m_frames = nullptr;
