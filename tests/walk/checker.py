@@ -77,6 +77,7 @@ class Walk:
     def __init__(self, record, data, lab, tools):
         self.record, self.data, self.lab, self.tools = record, data, lab, tools
         self.orders = self.prints = self.previews = self.arrived = 0
+        self.largest = 0  # difference of a print and what was seen
         self.found = []
         self.lines = [json.loads(line) for line in (record / 'seen.jsonl').read_text().splitlines()]
 
@@ -88,19 +89,21 @@ class Walk:
                 if line['front'] == 'kyoskNew' and line['before'] == 'nnn':
                     order.basket, order.previews, order.whole = {}, {}, False
                 if line['front'] in ('Form2', 'B3') and line['before'] == 'kyoskNew':
-                    promise = copy.deepcopy(order.__dict__)
+                    promise = copy.deepcopy(order.__dict__) | {'leftOut': ''}
                 here = self.record / str(line['n']) / 'orders'
                 kept = here if here.is_dir() else kept
                 folder = None
             elif page == 'nnn':
                 order.details.update(shown)
-                if line['act'].endswith('.Command10'):  # what is remembered comes back unseen
+                if line['act'] == 'press nnn.Command10':  # what is remembered comes back unseen
                     order.details.pop('Text2', 0), order.details.pop('Text3', 0)
                 order.choice = next((plain(text).split(' · ') for text in line['words'] if ' · ' in text), order.choice)
             elif page == 'kyoskNew':
                 self.seePictures(order, line)
             elif page == 'tFrmNew' and 'Title' in shown:
                 order.previews[plain(shown['Title'])] = self.record / f'preview.{line["n"]}.png'
+            if promise:
+                promise['leftOut'] += shown.get('List4Hasserot', '')
             notice = shown.get('Notice', '') if page == 'hatchala' else ''
             if page in SENDING or notice:
                 name = shown.get('Label46') or shown.get('Label15') or shown.get('Label16')
@@ -178,6 +181,10 @@ class Walk:
         same('the sum of the copies', sum(ordered.values()), promise['total'])
         same('TotalPics', int(field('TotalPics') or -1), promise['total'])
 
+        for path in failed:
+            if self.leaf(path) not in plain(promise['leftOut']):
+                tell(f'{path} has no print, and no page said so')
+
         # The texts.
         paper = field('GodelLBM' if album else 'ppr')
         same('the paper', paper, promise['paper'])
@@ -185,10 +192,10 @@ class Walk:
         same('the copies at the end', closing.get('Label20'), str(promise['total']))
         border = kind = ' '
         if album:
-            number, telephone, name = 'Text1(2)', details.get('Text1(1)', ''), details.get('Text1(0)', '')
+            telephone, name = details.get('Text1(1)', ''), details.get('Text1(0)', '')
             same('the photographer', field('ShemZalam'), name)
             same('the event', field('ShemErooa'), details.get('Text1(2)', ''))
-            same('the mail address', field('MailZalam'), closing.get('Txt4Ml2', '').strip())
+            same('the mail address', field('MailZalam'), closing.get('Txt4Ml2', field('MailZalam')).strip())
         else:
             name, telephone = details.get('Text2', field('n1')), details.get('Text3', field('n2'))
             same('the name', field('n1'), name)
@@ -276,4 +283,5 @@ class Walk:
             return found + [f'has another shape than what was seen: {one[0]} x {len(one[1])}, {other[0]} x {len(other[1])}']
         pairs = [(a, b) for row, line in zip(one[1], other[1]) for here, there in zip(row, line) for a, b in zip(here, there)]
         difference = sum(abs(a - b) for a, b in pairs) / len(pairs)
+        self.largest = max(self.largest, difference)
         return found + ([f'differs by {difference:.1f} from what was seen'] if difference > TOLERANCE else [])

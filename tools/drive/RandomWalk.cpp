@@ -122,6 +122,7 @@ constexpr WayRow wayOn[] = {
     {u"MoogMeret", u"Command28"},
     {u"B3", u"Command4Bli Command4Bli Command4Hazor"},
     {u"Form2", u"Command4Bli Command4Bli Command4Hazor"},
+    {u"B3", u"Command5"},
     {u"FtpFrm", u"Command4Bli Command4Bli Command4Hazor"},
     {u"FtpFrm", u"Command14"},
     {u"FtpFrm", u"Command28"},
@@ -138,7 +139,8 @@ constexpr WayRow wayOn[] = {
 const QSet<QString> exits = {u"hatchala.Image3"_s,   u"kyoskNew.Command15"_s, u"kyoskNew.Image10"_s,
                              u"FtpFrm.Command8"_s,   u"FtpFrm.Command11"_s,   u"FtpFrm.Command16"_s,
                              u"FtpFrm.Image3"_s,     u"UploadForm.Image3"_s,  u"UploadForm.endClose"_s,
-                             u"Havharot.Command2"_s, u"MoogMeret.Command6"_s};
+                             u"Havharot.Command2"_s, u"MoogMeret.Command6"_s, u"B3.Command7"_s,
+                             u"Form2.Command7"_s};
 
 bool isPreparing(const QString& page) {
     return page == u"B3" || page == u"Form2";
@@ -243,12 +245,11 @@ void RandomWalk::walk(Program& program) {
 }
 
 void RandomWalk::pageShown(const QString& page) {
-    const QString before = std::exchange(m_front, page);
+    const QString before = m_beforeFront = std::exchange(m_front, page);
     write({{u"front"_s, page}, {u"before"_s, before}});
     if (isSending(page) || isPreparing(before))
         keepOrders();
-    if (m_acts >= m_plan.presses && page == u"hatchala" && (isSending(before) || isPreparing(before)))
-        stop({});
+    m_fromOrder = isSending(before) || isPreparing(before);
 }
 
 void RandomWalk::stop(const QString& why) {
@@ -330,6 +331,8 @@ void RandomWalk::step() {
     m_program->window().renderNow();
     if (m_acts > m_plan.presses + pressesOfTheEnd)
         return stop(u"no way to the end of the order from %1"_s.arg(m_front));
+    if (m_acts >= m_plan.presses && hasOrderEnded())
+        return stop({});
     // Only a press uses up what the seed draws, however long the page lets it wait.
     const std::mt19937 before = m_random;
     const bool atWork = m_front == u"kyoskNew" || m_front == u"tFrmNew" || m_front == u"mikledet" || m_front == u"RedI";
@@ -343,6 +346,21 @@ void RandomWalk::step() {
     m_random = before;
     if (m_sinceAct.elapsed() > longestWait)
         stop(u"%1 has no way on"_s.arg(m_front));
+}
+
+// The order was sent, or the start page tells that it stays at this station.
+bool RandomWalk::hasOrderEnded() {
+    const PageView* view = m_program->window().frontView();
+    if (!m_fromOrder || m_front != u"hatchala" || !view)
+        return false;
+    QJsonObject line = seen(*view);
+    const bool ended = isSending(m_beforeFront) || line.value(u"shown"_s).toObject().contains(u"Notice"_s);
+    if (ended) {
+        line.insert(u"page"_s, m_front);
+        write(line);
+    }
+    m_fromOrder = false;
+    return ended;
 }
 
 // A box or a question lies over the page.
@@ -471,6 +489,8 @@ std::optional<RandomWalk::Act> RandomWalk::anyPressOn(const PageView& view) {
 std::optional<RandomWalk::Act> RandomWalk::actOn(const PageView& view, QWidget& widget) {
     const QString page = view.objectName();
     const QString name = widget.objectName();
+    if (!ControlFinder::whyNotPressable(widget).isEmpty())
+        return std::nullopt;
     auto* box = qobject_cast<QComboBox*>(&widget);
     if (qobject_cast<QLineEdit*>(&widget) || (box && box->isEditable() && draw(2) == 0))
         return type(page, name);
@@ -478,8 +498,6 @@ std::optional<RandomWalk::Act> RandomWalk::actOn(const PageView& view, QWidget& 
         const QStringList rows = rowsOf(widget);
         return rows.isEmpty() ? std::nullopt : std::optional(chooseRow(page, name, rows));
     }
-    if (!ControlFinder::whyNotPressable(widget).isEmpty())
-        return std::nullopt;
     if (qobject_cast<HoldButton*>(&widget) && draw(2) == 0)
         return hold(page, name, 60 + draw(500));
     if (qobject_cast<QAbstractButton*>(&widget))

@@ -59,6 +59,7 @@ private:
     };
 
     void step();
+    bool hasOrderEnded();
     bool answerPanel();
     void pressInTheMiddle();
     void perform(Act act);
@@ -101,6 +102,8 @@ private:
     bool m_inTheMiddle = false; // the same of a press in the middle of work
     qsizetype m_said = 0;       // index in ScreenDialogs::shownTexts
     QString m_front;
+    QString m_beforeFront;
+    bool m_fromOrder = false; // the page before the one in front prepared or sent an order
     bool m_over = false;
     QString m_failure;
 };
