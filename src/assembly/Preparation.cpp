@@ -62,12 +62,17 @@ bool Preparation::claimFolder(OrderFolder::Ending ending, Sender by) {
                                 : by == Sender::Http   ? OrderState::Way::Http
                                                        : OrderState::Way::Ftp;
     keep(m_journal->begin(m_state, way, m_lines, m_replaced));
+    for (int i = 0; m_goesOn && i < m_lines.size(); ++i) {
+        if (!isThere(i) && IsOtherPicture(m_state, m_platform.files, m_journal->state(), i))
+            m_others += i;
+    }
     return true;
 }
 
 Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
     const Files& files = m_platform.files;
     m_there.clear();
+    m_others.clear();
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
         m_journal.emplace(files, *m_folder);
         if (m_goesOn && m_journal->state().items == m_lines)
@@ -141,6 +146,12 @@ bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
     if (outcome.writeFailure)
         notWritten(*outcome.writeFailure);
     return outcome.packed;
+}
+
+bool Preparation::isGivenUp(int index, const DrivePath& picture) {
+    if (m_others.contains(index))
+        notPrepared(picture, LeftOut::Why::Gone);
+    return m_others.contains(index);
 }
 
 void Preparation::notPrepared(const DrivePath& picture, LeftOut::Why why) {

@@ -71,6 +71,10 @@ protected:
     bool forEachPicture(const std::function<void(int)>& step);
     // True for a line whose print the order has from before.
     bool isThere(int index) const { return m_there.contains(index); }
+    // True for a line at whose path another picture stands by now; it is told as not prepared.
+    bool isGivenUp(int index, const DrivePath& picture);
+    // The lines of which no print is made.
+    QSet<int> notMade() const { return m_there | m_others; }
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
     void notPrepared(const DrivePath& picture, LeftOut::Why why);
     // The order is held back: it has no print file, or no sheet. As built in, it goes on.
@@ -103,6 +107,7 @@ private:
 
     std::optional<OrderJournal> m_journal; // of m_folder
     QStringList m_failed;                  // paths of the pictures that could not be prepared
+    QSet<int> m_others;                    // indices of the lines with another picture in their place
     int m_prints = 0;                      // print files that this preparation has made
     bool m_withoutPrints = false;
     int m_writeFailures = 0;

@@ -27,6 +27,7 @@ struct Failure {
     };
     Kind kind = Kind::Other;
     QString message;
+    bool passing = false; // the other side has said that it may answer otherwise later
 };
 
 // A value or the failure that stands in its place.

@@ -20,6 +20,10 @@ void add(Lengths& lengths, const QString& name, std::optional<qint64> length) {
         kept = length;
 }
 
+QString endingOf(const QString& name) {
+    return name.mid(name.lastIndexOf(u'.') + 1).toLower();
+}
+
 } // namespace
 
 ArrivalProof ArrivalProof::of(const QList<LocalFile>& here, const QList<RemoteFile>& there, Names names) {
@@ -31,6 +35,11 @@ ArrivalProof ArrivalProof::of(const QList<LocalFile>& here, const QList<RemoteFi
             add(folded, file.name.toCaseFolded(), file.length);
     }
     ArrivalProof proof;
+    QSet<QString> measured; // endings of which a length was told
+    for (const RemoteFile& file : there) {
+        if (file.length)
+            measured += endingOf(file.name);
+    }
     QSet<QString> looked;
     for (const auto& [name, length] : here) {
         if (looked.contains(name))
@@ -47,7 +56,7 @@ ArrivalProof ArrivalProof::of(const QList<LocalFile>& here, const QList<RemoteFi
         else if (name == sharedName)
             proof.commonName += name;
         else if (!found->has_value())
-            proof.byName += name;
+            (measured.contains(endingOf(name)) ? proof.missing : proof.byName) += name;
         else if (**found == length)
             proof.byLength += name;
         else

@@ -30,6 +30,8 @@ struct ArrivalProof {
     // entry of the very name is taken before one of another letter case.
     static ArrivalProof of(const QList<LocalFile>& here, const QList<RemoteFile>& there, Names names);
 
+    // Not there, or without a length though the server tells that of another file of the same ending: one refused
+    // answer is no proof. A server may pack texts and tell no lengths of them alone.
     QStringList missing;
     QStringList broken;     // shorter or longer than here: to be removed and sent again
     QStringList byLength;   // proven

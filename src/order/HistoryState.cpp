@@ -56,7 +56,9 @@ bool HistoryState::areGuarded(const SessionState& state) const {
 
 Result<void> HistoryState::markLegacyArrived(const Files& files) const {
     for (const OrderFolder& folder : legacy) {
-        if (Result<void> marked = OrderJournal(files, folder).needsNoReport(); !marked)
+        OrderJournal journal(files, folder);
+        journal.markSentAgain();
+        if (Result<void> marked = journal.needsNoReport(); !marked)
             return marked;
     }
     return {};

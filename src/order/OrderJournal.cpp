@@ -1,8 +1,10 @@
 #include "order/OrderJournal.h"
 
+#include "order/BasketLine.h"
 #include "order/OrderChoices.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
+#include "order/PictureMark.h"
 #include "platform/files/Files.h"
 
 #include <algorithm>
@@ -68,6 +70,16 @@ Result<void> OrderJournal::keep(const OrderState& next) {
     return written;
 }
 
+// An order that goes on keeps the marks of its first start: another picture may stand at a path by now.
+QStringList OrderJournal::marksOf(const QStringList& lines, OrderKind kind) const {
+    if (lines == m_state.items && m_state.marks.size() == lines.size())
+        return m_state.marks;
+    QStringList marks;
+    for (const QString& line : lines)
+        marks += PictureMark(m_files, BasketLine::split(line, lineFormOf(kind)).path);
+    return marks;
+}
+
 Result<void> OrderJournal::begin(const SessionState& session, Way way, const QStringList& lines,
                                  const DrivePath& replaces) {
     OrderState next;
@@ -76,6 +88,7 @@ Result<void> OrderJournal::begin(const SessionState& session, Way way, const QSt
     next.kind = session.Optint;
     next.way = way;
     next.items = lines;
+    next.marks = marksOf(lines, session.Optint);
     next.choices = ChoicesOf(session);
     next.replaces = replaces.isEmpty() ? QString() : replaces.leaf();
     m_known = true;

@@ -67,6 +67,7 @@ public:
     Result<void> replacesNone();
 
 private:
+    QStringList marksOf(const QStringList& lines, OrderKind kind) const;
     void expectTheWorst();
     void makeKnown();
     Result<void> keep(const OrderState& next);

@@ -110,6 +110,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.filesInHand += value;
     else if (key == u"Shoora")
         state.items += value;
+    else if (key == u"Mark")
+        state.marks += value;
     else if (key.startsWith(choicePrefix))
         state.choices += {key.mid(choicePrefix.size()), value};
     else
@@ -154,6 +156,8 @@ QByteArray OrderState::write() const {
     if (phase <= Phase::Prepared) {
         for (const QString& item : items)
             writer.text(u"Shoora"_s, item);
+        for (const QString& mark : marks)
+            writer.text(u"Mark"_s, mark);
     }
     for (const auto& [key, value] : further)
         writer.text(key, value);

@@ -48,6 +48,7 @@ struct OrderState {
     Report report = Report::NotYet;
     QString replaces;               // folder name of the order that this one was prepared again from
     QStringList items;              // lines of the basket; kept until the sending begins
+    QStringList marks;              // PictureMark of each line's picture; none in a state of an older version
     QList<ListOutputEntry> choices; // as OrderChoices has them; kept until the lab was told
     QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
 

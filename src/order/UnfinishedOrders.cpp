@@ -12,6 +12,7 @@
 #include "order/OrderLog.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
+#include "order/PictureMark.h"
 #include "order/PrintFile.h"
 #include "order/PrintFileName.h"
 #include "platform/files/EmptyFolder.h"
@@ -33,17 +34,20 @@ using Way = OrderState::Way;
 namespace {
 
 // A corrected copy is there also where only the order has kept it.
-bool pictureIsThere(const BasketLine& line, LineForm form, const SessionState& state, const Files& files,
-                    const OrderFolder& folder) {
-    const DrivePath picture = PictureOf(line, form, state);
-    return files.fileExists(picture) ||
-           (picture != line.path && files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf()));
+bool pictureIsThere(const OrderFolder& folder, const OrderState& order, qsizetype line, const SessionState& state,
+                    const Files& files) {
+    const LineForm form = lineFormOf(order.kind);
+    const BasketLine item = BasketLine::split(order.items[line], form);
+    const DrivePath picture = PictureOf(item, form, state);
+    if (picture == item.path)
+        return files.fileExists(picture) && !IsOtherPicture(state, files, order, line);
+    return files.fileExists(picture) || files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf());
 }
 
 // A name outside the code page is never found: its picture fails in any case.
-bool isGone(const QString& item, LineForm form, const SessionState& state, const Files& files,
-            const OrderFolder& folder) {
-    return !HasQuestionMark(item) && !pictureIsThere(BasketLine::split(item, form), form, state, files, folder);
+bool isGone(const OrderFolder& folder, const OrderState& order, qsizetype line, const SessionState& state,
+            const Files& files) {
+    return !HasQuestionMark(order.items[line]) && !pictureIsThere(folder, order, line, state, files);
 }
 
 // The pictures that the log names as failed; no value where it can't be read.
@@ -181,7 +185,7 @@ UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files,
             fits = PrintFits(state, files, print);
         if (isThere && fits)
             ++counted.prepared;
-        else if (isGone(order.items[i], form, state, files, folder))
+        else if (isGone(folder, order, i, state, files))
             ++counted.gone;
     }
     return counted;
@@ -189,9 +193,23 @@ UnfinishedOrder UnfinishedOrderOf(const SessionState& state, const Files& files,
 
 int GonePictures(const SessionState& state, const Files& files, const UnfinishedOrder& order) {
     const LineForm form = lineFormOf(order.state.kind);
-    return static_cast<int>(std::count_if(order.state.items.begin(), order.state.items.end(), [&](const QString& item) {
-        return BasketLine::split(item, form).hasUsableName() && isGone(item, form, state, files, order.folder);
-    }));
+    int gone = 0;
+    for (qsizetype i = 0; i < order.state.items.size(); ++i) {
+        if (BasketLine::split(order.state.items[i], form).hasUsableName() &&
+            isGone(order.folder, order.state, i, state, files))
+            ++gone;
+    }
+    return gone;
+}
+
+bool IsOtherPicture(const SessionState& state, const Files& files, const OrderState& order, qsizetype line) {
+    const QString mark = order.marks.value(line);
+    const LineForm form = lineFormOf(order.kind);
+    const BasketLine item = BasketLine::split(order.items[line], form);
+    if (mark.isEmpty() || PictureOf(item, form, state) != item.path)
+        return false;
+    const QString now = PictureMark(files, item.path);
+    return !now.isEmpty() && now != mark;
 }
 
 bool PrintFits(const SessionState& state, const Files& files, const DrivePath& print) {
@@ -205,11 +223,12 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
     QStringList replaced;
     for (const QString& name : files.folders(orders)) {
         const OrderFolder folder(orders / name);
-        const Result<OrderState> order = ReadOrderState(files, folder);
-        if (!order)
+        const OrderJournal journal(files, folder);
+        if (!journal.known())
             continue;
-        replaced += order->replaces;
-        if (UnfinishedOrder counted = UnfinishedOrderOf(state, files, folder, *order); canGoOn(state, files, counted))
+        const OrderState& order = journal.state();
+        replaced += order.replaces;
+        if (UnfinishedOrder counted = UnfinishedOrderOf(state, files, folder, order); canGoOn(state, files, counted))
             unfinished += std::move(counted);
     }
     unfinished.removeIf([&](const UnfinishedOrder& order) { return replaced.contains(order.folder.name()); });

@@ -62,8 +62,12 @@ QString ThrowAwayQuestion(const SessionState& state, const QString& number);
 // Removes the order's folder with all that it holds.
 Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder);
 
-// How many pictures of the order's basket are no longer where they were, whether their prints are there or not.
+// How many pictures of the order's basket are no longer where they were, or have another one in their place, whether
+// their prints are there or not.
 int GonePictures(const SessionState& state, const Files& files, const UnfinishedOrder& order);
+
+// Another picture stands where the line's picture stood when the preparation began. Of a corrected copy always false.
+bool IsOtherPicture(const SessionState& state, const Files& files, const OrderState& order, qsizetype line);
 
 // True for a print file that reads in the shape that the lab asks for now: all prints of an order have one.
 bool PrintFits(const SessionState& state, const Files& files, const DrivePath& print);

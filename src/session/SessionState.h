@@ -212,6 +212,7 @@ struct HandOver {
     QString notice;          // a line for the customer that the start page shows
     DrivePath takenUp;       // folder of the order whose preparation goes on; empty for a new order
     DrivePath replaced;      // folder of the order that the next one is prepared again from
+    int renumbered = 0;      // times in a row that this was done
     QStringList basket;      // the lines that the page of pictures handed over, for the way back to it
     QStringList pictures;    // all pictures that it offered
     bool back = false;       // it takes both back

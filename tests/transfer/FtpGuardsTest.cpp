@@ -387,7 +387,7 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
              return content.replace("\r\n", "\1").replace("\n", "\r\n").replace("\1", "\r\n");
          }),
          CallLab, 0, false, false, Success},
-        {"a chosen part of an order that is not there", part, AllThere, -2, false, false, Success, true},
+        {"a chosen part of an order that is not there", part, PartThere, -2, false, false, Success, true},
         {"fewer than the log names, as agreed",
          [](Guarded& order) {
              order.remove(FtpFrmRig::second());
@@ -417,7 +417,7 @@ TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
                 EXPECT_EQ(order.kept().phase == Phase::Reported, hasArrived(one.builtIn) && !one.chosenPart);
                 continue;
             }
-            EXPECT_EQ(order.kept().sentBefore, one.chosenPart && one.end == AllThere) << "not offered as unfinished";
+            EXPECT_EQ(order.kept().sentBefore, one.chosenPart && one.end == PartThere) << "not offered as unfinished";
             EXPECT_EQ(order.lab.puts.size(), FtpFrmRig::names().size() + one.putsMore);
             EXPECT_EQ(order.lab.urls.size(), one.reported ? 3 : 0);
             EXPECT_TRUE(one.end != Success || one.putsMore > 0 || order.rig.page().controls().Label34.text.isEmpty())

@@ -19,14 +19,19 @@ using Report = OrderState::Report;
 using Told = ReportOnce::Told;
 
 struct HeardCalls final : ReportCalls {
-    void reportOrder(const QString& query) override {
+    bool reportOrder(const QString& query) override {
         onOrder();
         heard += query;
+        return answered;
     }
-    void reportDone(const QString& query) override { heard += query; }
+    bool reportDone(const QString& query) override {
+        heard += query;
+        return true;
+    }
 
     std::function<void()> onOrder = [] {};
     QStringList heard;
+    bool answered = true;
 };
 
 struct AReport : ::testing::Test {
@@ -114,6 +119,17 @@ TEST_F(AReport, goesOutForEachArrivalOrCarefullyOnceForAnOrder) {
             EXPECT_EQ(calls.heard.size(), 2);
             EXPECT_EQ(kept().report, Done);
         }
+    }
+}
+
+TEST_F(AReport, thatNoAnswerCameToStaysBegunCarefully) {
+    calls.answered = false;
+    for (const bool careful : {true, false}) {
+        state.Careful = careful;
+        ASSERT_TRUE(WriteOrderState(test.files, folder, {.phase = Phase::Arrived}));
+        OrderJournal journal(test.files, folder);
+        ReportOnce(state, test.files, journal, stop).tell(Sender::Ftp, calls);
+        EXPECT_EQ(kept().report, careful ? Report::Begun : Report::Done);
     }
 }
 

@@ -46,7 +46,7 @@ bool EditedPreparation::prepare(const QStringList& lines, std::optional<PaperSiz
     keep(kept().keepCorrected(m_lines));
     PrintPacker packer(m_state, m_platform.files, *m_folder, OrderTail::shortWidth);
     {
-        EditedPrints prints(m_state, m_platform.files, m_lines, m_there, paper);
+        EditedPrints prints(m_state, m_platform.files, m_lines, notMade(), paper);
         if (!forEachPicture([&](int i) { preparePicture(i, packer, prints); }))
             return false;
     }
@@ -72,6 +72,8 @@ void EditedPreparation::preparePicture(int index, PrintPacker& packer, EditedPri
         packer.removeScratch();
         return;
     }
+    if (isGivenUp(index, line.path))
+        return;
     if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
         saveThumbnail(line, packer.scratch());
     packer.removeScratch();

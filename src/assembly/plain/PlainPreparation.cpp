@@ -120,7 +120,7 @@ bool PlainPreparation::prepare(const QStringList& lines) {
         return false;
 
     PrintPacker packer(m_state, m_platform.files, *m_folder, m_state.SugTzad);
-    Prints prints(m_state, m_platform.files, m_lines, m_there);
+    Prints prints(m_state, m_platform.files, m_lines, notMade());
     if (!forEachPicture([&](int i) { packPicture(i, packer, prints); }))
         return false;
     if (isHeldBackForPrints())
@@ -157,7 +157,7 @@ void PlainPreparation::packPicture(int index, PrintPacker& packer, Prints& print
         return;
     }
     m_events.inWork(line.path);
-    if (isThere(index))
+    if (isThere(index) || isGivenUp(index, line.path))
         return;
     pack(packer, {index, line.code, line.path}, [&] { return prints.next([this] { m_platform.pump.pump(); }); });
 }

@@ -29,6 +29,8 @@ constexpr Poco::UInt16 ftpPort = 21;
 // Beyond these a server is not talking FTP.
 constexpr qsizetype longestReply = 64 * 1024;
 constexpr qsizetype longestListing = 16 * 1024 * 1024;
+constexpr int mostDelays = 10; // "ready in n minutes"
+constexpr int mostReads = 10;  // behind the end of a put, where nothing is to come
 constexpr std::size_t chunk = 64 * 1024;
 
 Result<void> noFailure() {
@@ -100,7 +102,9 @@ Failure FtpSessionWire::broken(Failure::Kind kind, const QString& reason) {
 Failure FtpSessionWire::refused(const Reply& reply) {
     if (reply.code == 421)
         close();
-    return {Failure::Kind::Refused, u"ftp %1: %2"_s.arg(m_host, AnsiCodePage::decode(reply.text).trimmed())};
+    // RFC 959: 4xx is a passing refusal.
+    return {Failure::Kind::Refused, u"ftp %1: %2"_s.arg(m_host, AnsiCodePage::decode(reply.text).trimmed()),
+            reply.code < 500};
 }
 
 // Every call of the library may throw; nothing passes this point. After a failure of the line the dialogue is out of
@@ -194,7 +198,7 @@ Result<void> FtpSessionWire::open(const QString& host, const QString& user, cons
         m_open = true;
         m_control.socket.setNoDelay(true);
         Reply greeting = readReply();
-        while (greeting.code >= 100 && greeting.code < 200) // "ready in n minutes"
+        for (int delays = 0; greeting.code >= 100 && greeting.code < 200 && delays < mostDelays; ++delays)
             greeting = readReply();
         auto result = completed(greeting.code) ? login(user, password) : refusedLogin(greeting);
         if (!result)
@@ -392,7 +396,8 @@ Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
     std::array<char, 16> rest;
     data.setReceiveTimeout(std::min(m_call.limits().silence, Poco::Timespan(2, 0)));
     try {
-        while (data.receiveBytes(rest.data(), static_cast<int>(rest.size())) > 0) {
+        for (int reads = 0; reads < mostReads && data.receiveBytes(rest.data(), static_cast<int>(rest.size())) > 0;
+             ++reads) {
         }
     } catch (const Poco::TimeoutException&) {
         // The server keeps the data connection open although it has all bytes; that does no harm.
@@ -495,9 +500,9 @@ Result<std::optional<qint64>> FtpSessionWire::length(const QString& remoteName) 
     return guarded([&]() -> Result<Length> {
         const auto typed = setType(FtpType::Image);
         if (!typed)
-            return m_open ? Result<Length>(Length()) : typed.failure();
+            return m_open && !typed.failure().passing ? Result<Length>(Length()) : typed.failure();
         const Reply reply = ask("SIZE " + *name);
-        if (reply.code == 421)
+        if (reply.code >= 400 && reply.code < 500)
             return refused(reply);
         bool known = false;
         const qint64 bytes = reply.text.mid(4).trimmed().toLongLong(&known);

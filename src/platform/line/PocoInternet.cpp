@@ -162,6 +162,11 @@ Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {
                 return answer.failure();
             if (answer->status == 404 || answer->status == 410)
                 return Failure{Failure::Kind::NotFound, u"%1: the server has no such file"_s.arg(url)};
+            // RFC 9110: timed out, too many requests, and faults of the server but "not implemented".
+            const int status = answer->status;
+            const bool busy = status == 408 || status == 429 || (status >= 500 && status != 501);
+            if (busy)
+                return Failure{Failure::Kind::Refused, u"%1: the server answered %2"_s.arg(url).arg(status)};
             return answer->good() ? answer->length : Length();
         },
         m_line->pump);

@@ -11,13 +11,21 @@
 
 namespace lumora {
 
+namespace {
+
+// A server may deny each folder and open it all the same.
+constexpr int mostInARow = 3;
+
+} // namespace
+
 Outcome PreparedAgain::way() const {
     return printsAsTheyAre(m_order.state().kind) ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;
 }
 
 bool PreparedAgain::isPossible() const {
     const OrderState& kept = m_order.state();
-    return !kept.items.isEmpty() && !ReplacementOf(m_state, m_platform.files, m_order.folder()) &&
+    return m_state.handOver.renumbered < mostInARow && !kept.items.isEmpty() &&
+           !ReplacementOf(m_state, m_platform.files, m_order.folder()) &&
            GonePictures(m_state, m_platform.files, {m_order.folder(), kept}) == 0;
 }
 
@@ -40,6 +48,7 @@ bool PreparedAgain::handOver(const IsTaken& isTaken) {
         if (!*taken)
             break;
     }
+    ++m_state.handOver.renumbered;
     m_state.handOver.lines = kept.items;
     m_state.handOver.basket.clear();
     m_state.handOver.pressStart = plain; // the page of edited orders starts by itself

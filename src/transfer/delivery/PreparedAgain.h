@@ -24,8 +24,8 @@ public:
 
     // To the page that prepares orders of this kind.
     Outcome way() const;
-    // False where the order was prepared again before, and where the basket is gone, or a picture of it: without its
-    // picture a print can't be made again, and the old order holds the only one.
+    // False where the order was prepared again before, or three others in a row were, and where the basket is gone, or
+    // a picture of it: without its picture a print can't be made again, and the old order holds the only one.
     bool isPossible() const;
 
     // Whether the server has a folder of this name; no value where it does not tell.

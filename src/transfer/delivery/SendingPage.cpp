@@ -84,7 +84,9 @@ QString SendingPage::advice(const PhaseLook& row) const {
     if (m_lacking && row.phase == SendingPhase::Reporting)
         return wording(fewerReportingWords);
     if (m_lacking && row.phase == SendingPhase::AllThere)
-        return wording(report().wasTold() ? fewerToldWords : fewerUntoldWords)
+        return wording(report().wasTold()      ? fewerToldWords
+                       : report().isUnwanted() ? fewerArrivedWords
+                                               : fewerUntoldWords)
             .arg(m_lacking->sent())
             .arg(m_lacking->named.value_or(0));
     return wording(row.advice);
@@ -94,6 +96,8 @@ QString SendingPage::advice(const PhaseLook& row) const {
 QString SendingPage::adviceOf(const PhaseLook& row) const {
     if (row.phase == SendingPhase::Waiting && isAnswerAwaited())
         return wording(answerAwaitedAdvice);
+    if (row.phase == SendingPhase::Success && m_state.Careful && report().isEndUnknown())
+        return wording(untoldAdvice);
     const bool lacksChosen = !m_state.transfer.leftOut.isEmpty();
     if (lacksChosen && row.phase == SendingPhase::Reporting)
         return wording(partReportingAdvice);

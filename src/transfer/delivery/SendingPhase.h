@@ -5,7 +5,7 @@
 
 namespace lumora {
 
-// The phase of a sending, for both senders. Only the FTP sender ends in Unclear.
+// The phase of a sending, for both senders. Only the FTP sender ends in Unclear and PartThere.
 enum class SendingPhase {
     Preparing, // the order is read; the HTTP sender asks which files the server has
     NoOrder,   // the order has no files
@@ -18,6 +18,7 @@ enum class SendingPhase {
     Reporting, // all files have arrived; the lab's site is told
     Success,
     AllThere,    // all files are on the server; a report was sent only where fewer pictures were agreed to
+    PartThere,   // the chosen files are on the server, and others of the order are not
     Unclear,     // the server's list gives no clear answer
     NotAll,      // files are missing after the last attempt
     Stopped,     // the customer has stopped the sending
@@ -29,7 +30,7 @@ constexpr bool isUnderWay(SendingPhase phase) {
     return phase == SendingPhase::Sending || phase == SendingPhase::Checking || phase == SendingPhase::Reporting;
 }
 constexpr bool hasArrived(SendingPhase phase) {
-    return phase == SendingPhase::Success || phase == SendingPhase::AllThere;
+    return phase == SendingPhase::Success || phase == SendingPhase::AllThere || phase == SendingPhase::PartThere;
 }
 
 enum class SendingSign { Seconds, Percent, Asking, Good, Held, Unclear, Bad };

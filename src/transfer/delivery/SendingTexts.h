@@ -33,6 +33,9 @@ inline constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפש�
                                          u"The whole order has arrived. You can close, or begin a new order."};
 inline constexpr SendingWords partSentAdvice{u"מה שבהזמנה הגיע. אפשר לסגור או להתחיל הזמנה חדשה.",
                                              u"What is in the order has arrived. You can close, or begin a new order."};
+inline constexpr SendingWords untoldAdvice{
+    u"ההזמנה הגיעה, ולא ידוע אם המעבדה קיבלה על כך הודעה. יש להודיע על כך לחנות.",
+    u"Your order has arrived, and it is not known whether the lab was told of it. Please tell the shop."};
 inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
                                             u"The order is kept on this computer. Please call the lab."};
 
@@ -58,6 +61,9 @@ inline constexpr SendingWords fewerReportingWords{u"ההזמנה הגיעה. מ�
 inline constexpr SendingWords fewerToldWords{
     u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרת, והמעבדה קיבלה על כך הודעה.",
     u"%1 of the %2 pictures in the order's log have arrived, as you agreed, and the lab was told."};
+inline constexpr SendingWords fewerArrivedWords{
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרת.",
+    u"%1 of the %2 pictures in the order's log have arrived, as you agreed."};
 inline constexpr SendingWords fewerUntoldWords{
     u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",
     u"%1 of the %2 pictures in the order's log have arrived, and the lab was not told. Please call the lab."};

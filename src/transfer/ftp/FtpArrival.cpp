@@ -32,6 +32,7 @@ const RemoteFile* entryOf(const QList<RemoteFile>& there, const QString& name) {
 
 void FtpArrival::beginOrder() {
     m_unanswered = 0;
+    m_answered = false;
     m_firstLooked = false;
     m_lengths.clear();
 }
@@ -41,13 +42,14 @@ bool FtpArrival::decides() const {
 }
 
 std::optional<qint64> FtpArrival::ask(FtpConnection& connection, const QString& name) {
-    if (m_unanswered >= ArrivalProof::mostUnanswered)
+    if (!m_answered && m_unanswered >= ArrivalProof::mostUnanswered)
         return std::nullopt;
     const Result<std::optional<qint64>> told = connection.length(name);
     const std::optional<qint64> length = told ? *told : std::nullopt;
     m_cut = m_cut || !told;
-    if (told)
-        m_unanswered = length ? 0 : m_unanswered + 1;
+    if (told && !m_answered)
+        m_unanswered += length ? 0 : 1;
+    m_answered = m_answered || length;
     return length;
 }
 

@@ -51,8 +51,9 @@ private:
 
     const SessionState& m_state;
     const Files& m_files;
-    bool m_cut = false;   // the line, while SIZE was asked
-    int m_unanswered = 0; // names in a row for which SIZE told no length
+    bool m_cut = false;      // the line, while SIZE was asked
+    int m_unanswered = 0;    // names for which SIZE told no length, before it told one
+    bool m_answered = false; // SIZE has told a length of this order
     bool m_firstLooked = false;
     QList<RemoteFile> m_lengths; // of the last proof
 };

@@ -61,9 +61,9 @@ FtpFolderOwner::Log FtpFolderOwner::logThere(const OrderJournal& order, FtpConne
     const Result<QByteArray> theirs = got ? m_files.read(fetched) : Result<QByteArray>(got.failure());
     static_cast<void>(m_files.removeFile(fetched)); // hidden; the next fetch replaces one that stays
     if (!theirs) {
-        const Failure::Kind why = theirs.failure().kind;
-        const bool answered = why == Failure::Kind::Refused || why == Failure::Kind::AccessDenied;
-        return answered ? Log::None : Log::NotKnown;
+        const Failure& why = theirs.failure();
+        const bool answered = why.kind == Failure::Kind::Refused || why.kind == Failure::Kind::AccessDenied;
+        return answered && !why.passing ? Log::None : Log::NotKnown;
     }
     return ours && *theirs == *ours ? Log::Same : Log::Other;
 }

@@ -49,7 +49,7 @@ std::span<const PhaseLook> FtpFrm::looks() const {
         PhaseLook{SendingPhase::Checking, SendingSign::Percent, None, {Stop}, sendingTitle, checkingAdvice},
         PhaseLook{SendingPhase::Reporting, SendingSign::Percent, None, {Stop}, sendingTitle, reportingAdvice},
         PhaseLook{SendingPhase::Success, SendingSign::Good, NewOrder, {NewOrder, Close}, sentTitle, sentAdvice, true},
-        // %1: files on the server, %2: files of the order; likewise in the next row.
+        // %1: files on the server, %2: files of the order; likewise in the next two rows.
         PhaseLook{SendingPhase::AllThere,
                   SendingSign::Good,
                   NewOrder,
@@ -59,6 +59,16 @@ std::span<const PhaseLook> FtpFrm::looks() const {
                    u"לחנות.",
                    u"All %2 files of this sending are on the server, whose folder holds %1. There is no need to send "
                    u"again. Please tell the shop."}},
+        PhaseLook{
+            SendingPhase::PartThere,
+            SendingSign::Unclear,
+            NewOrder,
+            {NewOrder, Close},
+            {u"חלק מההזמנה נמצא בשרת", u"A part of your order is on the server"},
+            {u"כל %2 הקבצים שנבחרו נמצאים בשרת, ובתיקייה שם %1 קבצים, אך ההזמנה אינה שלמה שם. כדי לשלוח את כולה יש "
+             u"לבחור אותה בהזמנות המוכנות.",
+             u"All %2 chosen files are on the server, whose folder holds %1, but the order is not whole there. To "
+             u"send all of it, choose it among the finished orders."}},
         PhaseLook{SendingPhase::Unclear,
                   SendingSign::Unclear,
                   SendAgain,

@@ -238,7 +238,9 @@ Arrival FtpSender::arrival(SendingPhase end) const {
 }
 
 SendingPhase FtpSender::arrivedEnd() const {
-    return check.proven == Arrival::Whole || !session.provesArrival() ? SendingPhase::Success : SendingPhase::AllThere;
+    if (check.proven == Arrival::Whole || !session.provesArrival())
+        return SendingPhase::Success;
+    return check.proven == Arrival::Agreed ? SendingPhase::AllThere : SendingPhase::PartThere;
 }
 
 SendingPhase FtpSender::changedEnd() {

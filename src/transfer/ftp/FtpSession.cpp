@@ -257,6 +257,10 @@ bool FtpSession::mayJoin(const QString& name) {
     using Owner = FtpFolderOwner::Owner;
     if (!m_journal || m_journal->folder().name() != name || m_owner == Owner::Ours)
         return true;
+    if (m_made && (m_listing.refused || !m_listing.unread.isEmpty())) {
+        m_owner = Owner::Ours;
+        return true;
+    }
     m_owner = m_folderOwner.of(*m_journal, *hConnection, m_listing);
     if (m_owner == Owner::NotKnown && !m_listing.unread.isEmpty())
         trouble(LineStep::List, {Failure::Kind::Damaged, m_listing.unread});
@@ -281,13 +285,14 @@ bool FtpSession::EnterOrderFolder() {
     }
     QString& name = m_transfer.ShemTikiya;
     name = OrderFolder(m_transfer.OrderFolder).name();
+    m_made = false;
     if (m_lists.List5.contains(name))
         return joinOrderFolder(name);
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
     m_inFolder.clear();
-    const bool made = FtpMakeOrderDir(name);
-    if (made) {
+    const bool made = m_made = FtpMakeOrderDir(name);
+    if (made && !m_folderOwner.asks()) {
         m_owner = FtpFolderOwner::Owner::Ours;
         keep(m_journal->sendingBegins(Sender::Ftp, true));
     }
@@ -296,8 +301,8 @@ bool FtpSession::EnterOrderFolder() {
         log(u"after MakeRemoteDir"_s);
         return false;
     }
-    // It may be there, though the listing above did not name it.
-    if (!made && m_folderOwner.asks())
+    // It may have been there, though the listing above did not name it, also where its making was answered well.
+    if (m_folderOwner.asks())
         return joinOrderFolder(name);
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {

@@ -144,6 +144,7 @@ private:
     std::optional<OrderJournal> m_journal;
     FtpFolderOwner m_folderOwner;
     FtpFolderOwner::Owner m_owner = FtpFolderOwner::Owner::NotKnown; // of the order's folder, until it is known
+    bool m_made = false; // the server has just answered well that it made the folder
     FtpArrival m_arrival;
     QList<RemoteFile> m_inFolder; // the files that List6 names
     FtpListing m_listing;         // that was read last

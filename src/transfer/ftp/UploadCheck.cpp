@@ -111,7 +111,8 @@ void UploadCheck::freshConnection() {
 bool UploadCheck::lookUp() {
     const QString& name = m_transfer.ShemTikiya;
     const QStringList before = m_lists.List6.items();
-    if (!m_lists.List5.contains(name) || !m_session.enterListedFolder(name))
+    // Some servers cut a long listing.
+    if ((!m_lists.List5.contains(name) && !m_session.provesArrival()) || !m_session.enterListedFolder(name))
         return false;
     unreadable = !m_session.unreadLine().isEmpty();
     if (!unreadable)

@@ -120,7 +120,7 @@ QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there)
         if (m_proven.contains(path) && m_proven[path] == length)
             continue;
         const bool stopped = m_stop.left || m_stop.StopFlag;
-        const bool asks = unanswered < most && cuts < most && !stopped;
+        const bool asks = (unanswered < most || !m_proven.isEmpty()) && cuts < most && !stopped;
         const Asked asked = asks ? ask(LeafName(path), there) : Asked{.cut = cuts > 0 || stopped};
         if (asked.cut || asked.gone) {
             cuts += asked.cut ? 1 : 0;
@@ -136,7 +136,7 @@ QStringList HttpArrival::unproven(const QStringList& paths, const Listed& there)
     const ArrivalProof proof = ArrivalProof::of(here, told, ArrivalProof::Names::WithoutCase);
     m_byName = !proof.byName.isEmpty();
     for (const QString& path : paths) {
-        if (proof.broken.contains(LeafName(path)))
+        if (proof.broken.contains(LeafName(path)) || proof.missing.contains(LeafName(path)))
             left += path;
     }
     return left;

@@ -51,7 +51,9 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
     const QString log = order.folder().logPath().leaf();
     if (std::none_of(answer.files->begin(), answer.files->end(),
                      [&](const QString& name) { return isSame(name, log); }))
-        return posted ? Owner::Unclaimed : Owner::Foreign;
+        return posted                                                    ? Owner::Unclaimed
+               : order.wasSentBefore() && isPartOf(order, *answer.files) ? Owner::Ours
+                                                                         : Owner::Foreign;
     switch (logThere(order, *answer.files, uploads)) {
     case Log::Same:
         return Owner::Ours;
@@ -67,8 +69,18 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
     return Owner::Foreign;
 }
 
+// An older version posted the log last.
+bool HttpFolderOwner::isPartOf(const OrderJournal& order, const QStringList& names) const {
+    const QStringList own = m_platform.files.names(order.folder().path(), u"*"_s);
+    return std::all_of(names.begin(), names.end(),
+                       [&](const QString& name) { return own.contains(name, Qt::CaseInsensitive); });
+}
+
 bool HttpFolderOwner::isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const {
-    return m_state.Careful && m_platform.files.fileExists(order.folder().logPath()) &&
+    const QString log = order.folder().logPath().leaf();
+    const bool isListed =
+        std::any_of(entries.begin(), entries.end(), [&](const QString& entry) { return isSame(entry.trimmed(), log); });
+    return m_state.Careful && isListed && m_platform.files.fileExists(order.folder().logPath()) &&
            logThere(order, entries, uploads) == Log::Other;
 }
 

@@ -15,7 +15,8 @@ struct SessionState;
 class HttpFolderOwner {
 public:
     enum class Owner {
-        Ours,      // claimed by this order, or with this order's log in it
+        Ours,      // claimed by this order, or with this order's log in it; of an order that an older version may have
+                   // sent, also with nothing but names of its own
         Unclaimed, // not there, or without a file, or with a part of the log that this order has posted
         Foreign,   // the log there differs by a byte at least, or there is none
         NotKnown,  // the list could not be read, the log was not given out, or the line was cut
@@ -35,6 +36,7 @@ public:
     bool isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
 
 private:
+    bool isPartOf(const OrderJournal& order, const QStringList& names) const;
     enum class Log { Same, Part, Other, Withheld, NotKnown };
     Log logThere(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
 

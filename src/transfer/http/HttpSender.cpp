@@ -104,6 +104,7 @@ void HttpSender::BuildOrderFileList() {
     report.beginOrder(&*m_journal);
     m_notKeptTold = false;
     m_owner = Owner::NotKnown;
+    m_lost = false;
     m_namesAsked = 0;
     QStringList inHand = m_journal->state().filesInHand;
     inHand.removeIf([this](const QString& path) { return !lists.List4Kvazim.contains(path); });
@@ -162,11 +163,15 @@ std::optional<SendingPhase> HttpSender::HttpAttempts() {
     return run(attempts);
 }
 
-std::optional<SendingPhase> HttpSender::sendMissing(int) {
+std::optional<SendingPhase> HttpSender::sendMissing(int attempt) {
     m_allPosted = true;
     // The answer may be hours old: the customer may have held the sending.
     if (m_owner == Owner::NotKnown || !isEntered())
         compare(m_listNumber);
+    else if (attempt == 1)
+        lookForAnother();
+    if (m_lost)
+        return endLost();
     // Another attempt could not post either, and would wait as long.
     if (m_owner == Owner::NotKnown && isTimeOut(m_listFailure) && !stop.StopFlag)
         endSilent();
@@ -237,9 +242,16 @@ void HttpSender::claimFolder() {
         m_owner = Owner::NotKnown;
 }
 
-// The other order has posted its log after this one's was found there.
-bool HttpSender::isClaimedByAnother() const {
-    return m_journal && m_folderOwner.isReplaced(*m_journal, lists.ListAfterWeb.items(), uploadsAddress());
+// Another order may post its log after this one's was found there.
+void HttpSender::lookForAnother() {
+    m_lost = m_journal && !stopped() && m_journal->ownsFolder(Sender::Http) &&
+             m_folderOwner.isReplaced(*m_journal, lists.ListAfterWeb.items(), uploadsAddress());
+}
+
+SendingPhase HttpSender::endLost() {
+    keep(m_journal->folderIsLost(Sender::Http));
+    m_events.failed(LineStep::FolderLost, {Failure::Kind::InUse, folderName()});
+    return SendingPhase::CallLab;
 }
 
 void HttpSender::post(const QString& path) {
@@ -281,12 +293,8 @@ std::optional<SendingPhase> HttpSender::checkArrival(int) {
             compare(HttpListGuard::first);
         m_listNumber = m_listGuard.nextList(lists.List4Hossarim.count(), m_verdict);
     }
-    // The other order may have come later.
-    if (ours && m_verdict == ServerVerdict::Listed && !stopped() && isClaimedByAnother()) {
-        keep(m_journal->folderIsLost(Sender::Http));
-        m_events.failed(LineStep::FolderLost, {Failure::Kind::InUse, folderName()});
-        return SendingPhase::CallLab;
-    }
+    if (m_lost)
+        return endLost();
     const bool all = ours && lists.List4Hossarim.isEmpty();
     const std::optional<SendingPhase> early = all ? std::nullopt : endEarly();
     // A failed post explains more than the list that lacks the file.
@@ -322,7 +330,7 @@ std::optional<SendingPhase> HttpSender::findMissing() {
     m_endedEarly = false;
     const OnLine line(*this);
     compare(0);
-    return endEarly();
+    return m_lost ? endLost() : endEarly();
 }
 
 void HttpSender::compare(int listNumber) {
@@ -331,6 +339,9 @@ void HttpSender::compare(int listNumber) {
     m_owner = m_journal && !stopped()
                   ? m_folderOwner.of(*m_journal, ReadServerAnswer(m_folderAnswer, folderName()), there.uploads)
                   : Owner::NotKnown;
+    m_lost = false;
+    if (m_verdict == ServerVerdict::Listed && m_owner == Owner::Ours)
+        lookForAnother();
     const QStringList order = lists.List4Kvazim.items();
     QStringList missing = lists.List4Hossarim.items();
     if (m_verdict == ServerVerdict::Listed && m_owner == Owner::Ours) {
@@ -400,6 +411,9 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
     HttpPause();
     if (!stopped())
         downloadList(listNumber);
+    // Without the script's answer the list file is of an earlier time.
+    if (!answer || !answer->good())
+        m_folderAnswer.clear();
     m_events.reached(SendingMoment::Answered);
     HttpPause(2);
 }
@@ -467,17 +481,20 @@ bool HttpSender::keepFoundThere() {
     return due;
 }
 
-void HttpSender::reportOrder(const QString& query) {
-    HttpSendReport(query);
+bool HttpSender::reportOrder(const QString& query) {
+    const bool heard = HttpSendReport(query);
     HttpPause(2);
+    return heard;
 }
 
-void HttpSender::HttpSendReport(const QString& query) const {
-    (void)FetchUrl(m_state.profile.ReportUrl + query);
+bool HttpSender::HttpSendReport(const QString& query) const {
+    const QString& address = m_state.profile.ReportUrl;
+    return m_platform.internet.fetch(address + query) || address.isEmpty();
 }
 
-void HttpSender::HttpSendDone(const QString& query) const {
-    (void)FetchUrl(m_state.profile.HttpDoneUrl + query);
+bool HttpSender::HttpSendDone(const QString& query) const {
+    const QString& address = m_state.profile.HttpDoneUrl;
+    return m_platform.internet.fetch(address + query) || address.isEmpty();
 }
 
 void HttpSender::postTestPicture() {

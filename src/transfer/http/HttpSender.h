@@ -84,8 +84,9 @@ public:
     // order.
     bool keepFoundThere();
 
-    void HttpSendReport(const QString& query) const;
-    void HttpSendDone(const QString& query) const;
+    // False where no answer came. A lab without such an address wants no such call.
+    bool HttpSendReport(const QString& query) const;
+    bool HttpSendDone(const QString& query) const;
     void HttpPause(int times = 1);
 
     // The lab's tests of its scripts; the answers are in TxtWeb.
@@ -93,9 +94,8 @@ public:
     void postNothing();
     void fetchTestListing();
 
-    // The answers of report and done call are ignored.
-    void reportOrder(const QString& query) override;
-    void reportDone(const QString& query) override { HttpSendDone(query); }
+    bool reportOrder(const QString& query) override;
+    bool reportDone(const QString& query) override { return HttpSendDone(query); }
 
     HttpLists lists;
     SendingStop stop;
@@ -112,7 +112,8 @@ private:
     void compare(int listNumber);
     bool isEntered() const; // the folder needs no further question whose it is
     void claimFolder();
-    bool isClaimedByAnother() const;
+    void lookForAnother();
+    SendingPhase endLost();
     bool stopped() const { return m_stop.left || m_stop.StopFlag; }
     void endSilent();
     std::optional<SendingPhase> endEarly();
@@ -138,6 +139,7 @@ private:
     HttpArrival m_arrival;
     HttpFolderOwner m_folderOwner;
     Owner m_owner = Owner::NotKnown; // by the last check
+    bool m_lost = false;             // another order has taken the folder since
     bool m_onLine = false;           // a sending or a check runs
     bool m_silent = false;           // the line was cut because nothing moved on it
     bool m_endedEarly = false;

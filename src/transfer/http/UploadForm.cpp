@@ -177,7 +177,6 @@ void UploadForm::stopCount() {
     if (!idle() || phase() != SendingPhase::Countdown)
         return;
     stopTimers();
-    Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
     enter(SendingPhase::Waiting);
 }
 
@@ -238,7 +237,8 @@ void UploadForm::prepareOrderAgain() {
         endIncomplete(SendingPhase::Stopped);
         return;
     }
-    tellReason(LineStep::ForeignFolder, {Failure::Kind::InUse, m_orderName}, {});
+    const bool sentBefore = m_sender.journal()->state().phase >= OrderState::Phase::Sending;
+    tellReason(sentBefore ? LineStep::FolderLost : LineStep::ForeignFolder, {Failure::Kind::InUse, m_orderName}, {});
     endIncomplete(SendingPhase::CallLab);
 }
 

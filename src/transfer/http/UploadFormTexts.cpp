@@ -23,7 +23,7 @@ constexpr SendingWords filesLeft{u"מספר הקבצים שנותרו למשלו
 
 } // namespace
 
-// The page never enters Unclear, and NumberTaken leads to another page.
+// The page never enters Unclear or PartThere, and NumberTaken leads to another page.
 std::span<const PhaseLook> UploadForm::looks() const {
     using enum SendingButton;
     static constexpr std::array rows{
@@ -96,6 +96,8 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Command10.enabled = !isAnswerAwaited();
     endClose.visible = row.buttons.testFlag(Close);
     Label11.visible = row.phase == SendingPhase::AllThere && !m_lacking;
+    if (row.phase == SendingPhase::Waiting)
+        Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
     if (!isUnderWay(row.phase) && row.phase != SendingPhase::Preparing)
         Pic4Hamten.visible = false;
     showCount();

@@ -20,11 +20,23 @@ InetForm::InetForm(const SessionState& state, const Platform& platform, PageChai
     Q_UNUSED(chain);
 }
 
-QString InetForm::FetchUrlSmall(const QString& url) {
+std::optional<QString> InetForm::answerOf(const QString& url) {
     if (!m_platform.internet.open())
         m_platform.dialogs.message(m_state.wording(u"אין תקשורת"_s, u"No communication"_s));
     const auto answer = m_platform.internet.fetch(url);
-    return answer ? AnsiCodePage::decode(answer->body) : QString();
+    return answer ? std::optional(AnsiCodePage::decode(answer->body)) : std::nullopt;
+}
+
+QString InetForm::FetchUrlSmall(const QString& url) {
+    return answerOf(url).value_or(QString());
+}
+
+// A lab without such an address wants no such call.
+bool InetForm::call(const QString& address, const QString& query) {
+    const std::optional<QString> answer = answerOf(address + query);
+    TeshuvatSharat = answer.value_or(QString());
+    Q_EMIT changed();
+    return answer || address.isEmpty();
 }
 
 void InetForm::report() {
@@ -42,14 +54,12 @@ void InetForm::announceReport() {
     TeshuvatSharat = FetchUrlSmall(m_state.profile.ReportUrl + u"c.txt"_s);
 }
 
-void InetForm::reportOrder(const QString& query) {
-    TeshuvatSharat = FetchUrlSmall(m_state.profile.ReportUrl + query);
-    Q_EMIT changed();
+bool InetForm::reportOrder(const QString& query) {
+    return call(m_state.profile.ReportUrl, query);
 }
 
-void InetForm::reportDone(const QString& query) {
-    TeshuvatSharat = FetchUrlSmall(m_state.profile.DoneUrl + query);
-    Q_EMIT changed();
+bool InetForm::reportDone(const QString& query) {
+    return call(m_state.profile.DoneUrl, query);
 }
 
 bool clsDownload::download(const QString& url, const DrivePath& path) {

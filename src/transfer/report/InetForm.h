@@ -5,6 +5,8 @@
 #include "session/Page.h"
 #include "transfer/report/ReportOnce.h"
 
+#include <optional>
+
 namespace lumora {
 
 class PageChain;
@@ -12,8 +14,8 @@ struct Platform;
 struct SessionState;
 
 // InetForm, "the two reports" in the glossary: a page without a view, by which the sending page tells the lab's web
-// site that an order has arrived. Nothing reads the answers, and a lost report changes nothing: the order is on the
-// server.
+// site that an order has arrived. Nothing reads the answers. A report that no answer came to is told by Careful; the
+// order is on the server in any case.
 class InetForm : public Page, public ReportCalls {
     Q_OBJECT
 public:
@@ -26,8 +28,8 @@ public:
     void Command2_Click() { reportDone(doneQuery()); }
 
     void announceReport() override;
-    void reportOrder(const QString& query) override;
-    void reportDone(const QString& query) override;
+    bool reportOrder(const QString& query) override;
+    bool reportDone(const QString& query) override;
 
     // State.
     const QString& answer() const { return TeshuvatSharat; } // of the last call
@@ -36,6 +38,8 @@ public:
     QString FetchUrlSmall(const QString& url);
 
 private:
+    bool call(const QString& address, const QString& query);
+    std::optional<QString> answerOf(const QString& url);
     void report();
     QString doneQuery() const;
 

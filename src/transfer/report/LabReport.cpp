@@ -41,7 +41,7 @@ void LabReport::endUntold() {
     if (!m_order)
         return;
     ReportOnce reports(m_state, m_platform.files, *m_order, m_stop);
-    reports.endsUntold();
+    reports.endsUntold(m_by);
     m_keep(reports.kept());
 }
 
@@ -54,11 +54,11 @@ bool LabReport::isAsAgreed() const {
 }
 
 bool LabReport::isDueAsAgreed() const {
-    return isAsAgreed() && isDueWhereFound();
+    return isAsAgreed() && ReportOnce(m_state, m_platform.files, *m_order, m_stop).isDue(m_by);
 }
 
 SendingPhase LabReport::endWhereLeft() const {
-    return isDueAsAgreed() ? SendingPhase::AllThere : SendingPhase::Success;
+    return isAsAgreed() && m_state.Careful ? SendingPhase::AllThere : SendingPhase::Success;
 }
 
 void LabReport::tell(ReportCalls& calls) {
@@ -100,6 +100,10 @@ bool LabReport::mayTellAgain() const {
 
 bool LabReport::wasTold() const {
     return m_order && m_order->state().report == Report::Done;
+}
+
+bool LabReport::isUnwanted() const {
+    return m_order && m_order->state().phase == Phase::Reported && m_order->state().report == Report::NotYet;
 }
 
 bool LabReport::isEndUnknown() const {

@@ -57,6 +57,8 @@ public:
     bool mayTellAgain() const;
     // The lab was told to the end.
     bool wasTold() const;
+    // The order has arrived, and the lab wants no report of it.
+    bool isUnwanted() const;
     // A telling was begun, and it is not known whether the lab has heard it.
     bool isEndUnknown() const;
     // The order has arrived, and the server told no lengths to prove it by. As built in none are asked for.

@@ -47,13 +47,17 @@ ReportOnce::Told ReportOnce::tell(Sender by, ReportCalls& calls) {
     return Told::NotWanted;
 }
 
-bool ReportOnce::isDueWhereFound(Sender by) const {
-    return m_state.Careful && !m_journal.state().sentBefore && !toldOrUnwanted() && isWanted(by);
+bool ReportOnce::isDue(Sender by) const {
+    return m_state.Careful && !toldOrUnwanted() && isWanted(by);
 }
 
-void ReportOnce::endsUntold() {
+bool ReportOnce::isDueWhereFound(Sender by) const {
+    return isDue(by) && !m_journal.state().sentBefore;
+}
+
+void ReportOnce::endsUntold(Sender by) {
     m_kept = {};
-    if (!m_state.Careful)
+    if (!m_state.Careful || !isWanted(by))
         keep(m_journal.needsNoReport());
 }
 
@@ -85,11 +89,9 @@ bool ReportOnce::makeCalls(ReportCalls& calls) const {
     const QString order = OrderReportQuery(m_state.profile, m_state.transfer, details(), form);
     if (!isStopped())
         calls.announceReport();
-    if (!isStopped())
-        calls.reportOrder(order);
-    if (!isStopped())
-        calls.reportDone(DoneQuery(m_state.profile, m_state.transfer, form));
-    return !isStopped();
+    const bool heard = !isStopped() && calls.reportOrder(order);
+    const bool done = !isStopped() && calls.reportDone(DoneQuery(m_state.profile, m_state.transfer, form));
+    return !isStopped() && ((heard && done) || !m_state.Careful);
 }
 
 OrderDetails ReportOnce::details() const {

@@ -13,13 +13,14 @@ class Files;
 class OrderJournal;
 struct SendingStop;
 
-// The requests that tell the lab's site of an order, as one of the senders makes them. Their answers are not looked at.
+// The requests that tell the lab's site of an order, as one of the senders makes them. What an answer says is not
+// looked at; false: none came.
 class ReportCalls {
 public:
     // Before the report.
     virtual void announceReport() {}
-    virtual void reportOrder(const QString& query) = 0;
-    virtual void reportDone(const QString& query) = 0;
+    virtual bool reportOrder(const QString& query) = 0;
+    virtual bool reportDone(const QString& query) = 0;
 
 protected:
     ~ReportCalls() = default;
@@ -49,11 +50,14 @@ public:
     // Whatever was told before, for an operator who knows that the lab has heard nothing.
     Told tellAgain(ReportCalls& calls);
 
-    // For an order that lay whole on the server before anything was sent: true where tell() would tell of it now. As
-    // built in, such an order is never told of.
+    // True where tell() would tell of the order now; as built in never.
+    bool isDue(Sender by) const;
+    // For an order that lay whole on the server before anything was sent; one that an older version may have sent was
+    // told of then.
     bool isDueWhereFound(Sender by) const;
-    // The order has arrived and ends untold; as built in, nothing is left to tell of it then.
-    void endsUntold();
+    // The order has arrived and ends untold. As built in, and where the lab wants no report of it, nothing is left to
+    // tell of it then.
+    void endsUntold(Sender by);
 
     // Of the last call: fails where a step of the telling could not be written to the order's folder.
     const Result<void>& kept() const { return m_kept; }
