@@ -136,6 +136,9 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
         EXPECT_EQ(offered(), c.offered ? QStringList(name) : QStringList()) << (&c - cases);
         ASSERT_TRUE(ThrowAwayOrder(test.files, folder));
     }
+    const OrderFolder damaged = give(name, {print, u".order"_s});
+    EXPECT_EQ(offered(), QStringList(name)) << "its state can't be read";
+    ASSERT_TRUE(ThrowAwayOrder(test.files, damaged));
     session.profile.FtpUser.clear();
     const OrderFolder noServer = give(name, inPhase(Phase::Sending), {print});
     EXPECT_TRUE(offered().isEmpty()) << "there is no server to go on with";
@@ -156,6 +159,10 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
     EXPECT_EQ(found[0].pictures, 3) << "a name that is too short has no print";
     EXPECT_EQ(found[0].prepared, 1) << "its own picture may be gone";
     EXPECT_EQ(found[0].gone, 1);
+    UnfinishedOrder swapped = found[0];
+    const int gone = GonePictures(session, test.files, swapped);
+    swapped.state.marks = QStringList(swapped.state.items.size(), u"1 of another picture"_s);
+    EXPECT_EQ(GonePictures(session, test.files, swapped), gone + 1) << "another card is in the drive";
     session.profile.JppChunks = 40;
     EXPECT_EQ(UnfinishedOrders(session, test.files)[0].gone, 2) << "a print of another shape is made again";
 
