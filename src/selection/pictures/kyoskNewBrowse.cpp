@@ -226,7 +226,7 @@ void kyoskNew::showLarge(const DrivePath& path) {
     }
 }
 
-// The paper turns with the view, and so does not depend on it.
+// A quarter turn of the view turns the paper with the picture.
 void kyoskNew::showPaper() {
     const std::optional<PaperSize> paper = Picture2.bitmap.isNull() ? std::nullopt : m_resolution.paper();
     Picture2.paper = paper ? paperOnPicture(m_largeSize, *paper, m_resolution.fit()) : QRectF();
