@@ -16,11 +16,8 @@
 #include <random>
 #include <vector>
 
-class QUrl;
-
 namespace lumora {
 
-class MessagePanel;
 class PageView;
 class Program;
 
