@@ -71,6 +71,8 @@ void LeftOutBox::goBack() {
         return;
     }
     m_state.handOver.back = true;
+    // The sending page has read the order's details from its log, which the code page may have changed.
+    m_state.shemot = m_state.handOver.details;
     if (m_chain.follow(m_page, Outcome::PicturesWanted))
         removeOrder();
     else

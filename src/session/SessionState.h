@@ -201,8 +201,17 @@ struct TransferState {
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;
     std::int16_t MailFlag = 0; // cleared at the start of each order
-    QList<LeftOut> leftOut;    // of the new order that is being prepared or sent
+    QList<LeftOut> leftOut;    // of the order that is being prepared or sent
     bool leftOutAsked = false; // the customer goes on without them
+};
+
+// The closing panel of the page of pictures as the customer left it.
+struct ClosingEntries {
+    QString Text1;            // mail address, before the "@"
+    QString Combo1;           // behind it
+    int Combo1Index = -1;     // row of the list; -1: typed
+    bool promptStands = true; // Combo1 shows its prompt
+    QString Text2;            // note
 };
 
 // The lines that one page copies into a list of the next, and what it asks the next page to do with them.
@@ -215,7 +224,9 @@ struct HandOver {
     int renumbered = 0;      // times in a row that this was done
     QStringList basket;      // the lines that the page of pictures handed over, for the way back to it
     QStringList pictures;    // all pictures that it offered
-    bool back = false;       // it takes both back
+    ClosingEntries closing;  // what was typed there
+    OrderDetails details;    // of the order, without mail address and note
+    bool back = false;       // it takes all of them back
 };
 
 struct SessionState {

@@ -233,6 +233,13 @@ TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
     EXPECT_FALSE(page.controls().resolution[0].visible) << "the photographer lays out an album";
     EXPECT_TRUE(!page.controls().Image13.visible && page.controls().Image7.visible)
         << "there is always a way to finish";
+    state.coupon.HaKoopon = 1;
+    state.coupon.MisparKoopon = 9; // of a size that an earlier customer chose
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        page.Image7_Click();
+        EXPECT_EQ(page.controls().Frame4.visible, careful);
+    }
     for (const bool deep : {false, true}) {
         state.DchisatAlbum = deep;
         page.Image7_Click();
@@ -377,11 +384,16 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     EXPECT_EQ(state.shemot.Mail + u'|' + state.shemot.Hearot, u"dana@example.com|gift - "_s);
 
     state.handOver.back = true; // a picture could not be prepared
-    const kyoskNewControls& again = open().controls();
-    EXPECT_EQ(again.List1.items(), state.handOver.lines);
-    EXPECT_EQ(again.List4.items(), QStringList({u"C:\\p\\01.jpg"_s, u"C:\\p\\02.jpg"_s}));
-    EXPECT_EQ(again.Label7.text + again.Label4[1].text + again.Text1.text + again.Text2.text, u"32danagift"_s);
-    chain.unload(PageId::kyoskNew);
+    const QStringList lines = state.handOver.lines;
+    kyoskNew& again = open();
+    const kyoskNewControls& shown = again.controls();
+    EXPECT_EQ(shown.List1.items(), lines);
+    EXPECT_EQ(shown.List4.items(), QStringList({u"C:\\p\\01.jpg"_s, u"C:\\p\\02.jpg"_s}));
+    EXPECT_EQ(shown.Label7.text + shown.Label4[1].text + shown.Text1.text + shown.Text2.text, u"32danagift"_s);
+    again.Image7_Click();
+    again.Command8_Click();
+    EXPECT_EQ(state.handOver.lines, lines);
+    EXPECT_EQ(state.shemot.Mail + u'|' + state.shemot.Hearot, u"dana@example.com|gift - "_s);
     EXPECT_TRUE(open().controls().List1.isEmpty()) << "once";
 }
 
@@ -475,10 +487,12 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     page.Command28_Click();
     // The lab reads Hebrew; a delivery to the home needs an address.
     state.EnglishTips = 1;
-    state.Careful = true;
-    state.profile.Branches[10].caption = u"משלוח לבית"_s;
+    state.profile.Branches[10].caption = u"משלוח - לבית"_s;
     page.Image7_Click();
     machine.dialogs.messages.clear();
+    page.Command4Snif_Click(10);
+    EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << "as built in the order leaves without one";
+    state.Careful = true;
     page.Command4Snif_Click(10);
     page.Command8_Click();
     EXPECT_EQ(machine.dialogs.messages.size(), 2);
@@ -488,7 +502,14 @@ TEST_F(ThePictures, ofACouponMustMatchItAndTellTheBranch) {
     page.Image7_Click();
     EXPECT_TRUE(shown.Frame4.visible);
     page.Command8_Click();
-    EXPECT_EQ(state.shemot.Hearot, u"5 Herzl, Haifa - משלוח לבית"_s);
+    EXPECT_EQ(state.shemot.Hearot, u"5 Herzl, Haifa - משלוח - לבית"_s);
+    state.shemot.Hearot = u"???"_s; // of the log
+    state.handOver.back = true;
+    kyoskNew& again = open();
+    again.Image7_Click();
+    again.Command28_Click();
+    again.Command8_Click();
+    EXPECT_EQ(state.shemot.Hearot, u"5 Herzl, Haifa - משלוח - לבית"_s);
 }
 
 } // namespace

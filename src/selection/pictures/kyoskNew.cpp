@@ -13,7 +13,6 @@
 
 #include <QTimer>
 
-#include <algorithm>
 #include <utility>
 
 namespace lumora {
@@ -46,7 +45,6 @@ void kyoskNew::load() {
     UnpackEditState(EditRecord::newPicture(), m_state.edit);
     m_state.edit.PicturePath = {};
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
-    m_state.BranchChoice.clear();
     m_choice.setForm(lineFormOf(m_state.Optint));
     decideCompression();
 
@@ -62,10 +60,11 @@ void kyoskNew::load() {
     Label17.visible = Command8.visible = box != AddressBox::None;
     Label33.visible = box != AddressBox::None && !m_state.DoarReshut;
 
-    const QStringList basket = std::exchange(m_state.handOver.basket, {});
-    const QStringList pictures = std::exchange(m_state.handOver.pictures, {});
-    if (std::exchange(m_state.handOver.back, false))
-        takeBack(basket, pictures);
+    const HandOver before = std::exchange(m_state.handOver, {});
+    if (before.back)
+        takeBack(before);
+    else
+        m_state.BranchChoice.clear();
     showChoice();
     if (plain())
         return;
@@ -77,15 +76,18 @@ void kyoskNew::load() {
     connect(&editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
 }
 
-// Address and note are those that were typed before.
-void kyoskNew::takeBack(const QStringList& basket, const QStringList& pictures) {
-    m_choice.takeBack(basket, pictures);
+// Address, note and branch are those that were chosen before.
+void kyoskNew::takeBack(const HandOver& before) {
+    m_tookBack = true;
+    m_choice.takeBack(before.basket, before.pictures);
     m_choice.nextPage();
     showPictureCount();
     showGuide(Guide::PicturesShown);
-    const OrderDetails& order = m_state.shemot;
-    Text1.text = order.Mail.left(std::max<qsizetype>(0, order.Mail.indexOf(u'@')));
-    Text2.text = order.Hearot.left(std::max<qsizetype>(0, order.Hearot.lastIndexOf(u" - "_s)));
+    Text1.text = before.closing.Text1;
+    Combo1.text = before.closing.Combo1;
+    Combo1Index = before.closing.Combo1Index;
+    m_promptStands = before.closing.promptStands;
+    Text2.text = before.closing.Text2;
     // Drawing pumps events, and this page is not shown yet.
     QTimer::singleShot(0, this, [this] {
         if (!m_handedOver)

@@ -18,6 +18,7 @@ namespace lumora {
 
 class PageChain;
 struct Platform;
+struct HandOver;
 struct SessionState;
 class tFrmNew;
 
@@ -122,7 +123,7 @@ private:
     enum class Guide { None, PicturesShown, ChooseByHand };
 
     void say(const char16_t* hebrew, const char16_t* english);
-    void takeBack(const QStringList& basket, const QStringList& pictures);
+    void takeBack(const HandOver& before);
     void showChoice();
     void showCell(int cell);
     void takeInHand(const QString& path);
@@ -220,6 +221,7 @@ private:
     bool m_countShown = false;  // a folder was picked, and its pictures were counted
     bool m_picking = false;     // the file dialog is open
     bool m_promptStands = true; // Combo1 shows its prompt
+    bool m_tookBack = false;    // the order was prepared before, and came back
     bool m_handedOver = false;
     bool m_handOverFailed = false; // told once, and not at each touch
     Guide m_guide = Guide::None;

@@ -34,7 +34,7 @@ void kyoskNew::finishAlbum() {
 void kyoskNew::checkAndClose() {
     PicB4Sioom.visible = Frame4.visible = false;
     Combo1Items = mailDomains();
-    if (!MailAddressGuard(m_state).keepsDomain(typedAddress())) {
+    if (!m_tookBack && !MailAddressGuard(m_state).keepsDomain(typedAddress())) {
         Combo1Index = -1;
         m_promptStands = true;
         Combo1.text = mailDomainPrompt(m_state.english());
@@ -232,6 +232,8 @@ void kyoskNew::handOver(const QString& mail) {
     if (m_handedOver || !homeAddressKnown())
         return;
     m_handedOver = true;
+    m_state.handOver.closing = {Text1.text, Combo1.text, Combo1Index, m_promptStands, Text2.text};
+    m_state.handOver.details = m_state.shemot;
     m_state.shemot.Hearot = Text2.text + u" - "_s + m_state.BranchChoice;
     m_state.shemot.Mail = mail;
     if (!plain())
