@@ -11,7 +11,7 @@ namespace {
 QString reasonText(const SessionState& state, LeftOut::Why why) {
     switch (why) {
     case LeftOut::Why::NoJpeg:
-        return state.wording(u"אינה קובץ jpg", u"not a jpg file");
+        return state.wording(u"סיומת הקובץ אינה jpg או JPG", u"its ending is not jpg or JPG");
     case LeftOut::Why::Name:
         return state.wording(u"בשם הקובץ יש אות שאינה נתמכת", u"its file name has a letter that can't be used");
     case LeftOut::Why::Gone:

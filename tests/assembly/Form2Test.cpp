@@ -185,7 +185,7 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
     const QStringList mixed = {good, bad, line(u"C:\\pics\\caf?.jpg"_s), line(u"C:\\pics\\gone.jpg"_s),
                                line(u"C:\\x.png"_s)};
     const QString named = u"bad.jpg – לא ניתן לקרוא את הקובץ|caf?.jpg – בשם הקובץ יש אות שאינה נתמכת|"
-                          u"gone.jpg – הקובץ לא נמצא|x.png – אינה קובץ jpg"_s;
+                          u"gone.jpg – הקובץ לא נמצא|x.png – סיומת הקובץ אינה jpg או JPG"_s;
     enum class Answer { None, GoOn, Back };
     const struct {
         bool careful, station;
@@ -208,6 +208,7 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
         state.Careful = c.careful;
         state.TachanaMekomit = c.station;
         state.handOver.basket = c.items;
+        state.handOver.details = state.shemot;
         Form2& page = openWith(c.items);
         page.setTexts();
         page.Command3_Click();

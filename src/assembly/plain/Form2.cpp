@@ -134,8 +134,8 @@ void Form2::showProgress() {
     PreparationPage::showProgress();
     Label4removed.visible = !List4removed.isEmpty();
     Label4removed.text = m_state
-                             .wording(u"%1 קבצים שאינם תמונות jpg הוסרו מהרשימה:"_s,
-                                      u"Files that are no jpg pictures and were left out: %1"_s)
+                             .wording(u"%1 קבצים שסיומתם אינה jpg או JPG הוסרו מהרשימה:"_s,
+                                      u"Files whose ending is not jpg or JPG were left out: %1"_s)
                              .arg(List4removed.count());
 }
 
