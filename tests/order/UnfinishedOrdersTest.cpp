@@ -178,9 +178,12 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
     order.state.kind = OrderKind::EditedPrint;
     EXPECT_EQ(TakeUpOrder(order, next, test.files), Outcome::EditedTakenUp);
     for (const Way way : {Way::Ftp, Way::Http}) {
-        OrderState state = inPhase(Phase::Sending);
+        OrderState state = inPhase(way == Way::Http ? Phase::Sending : Phase::Prepared);
         state.way = way;
         const OrderFolder folder = give(name + u'P', state);
+        const QStringList failed = {u"C:\\pics\\caf?.jpg"_s, u"C:\\pics\\gone.jpg"_s};
+        ASSERT_TRUE(test.files.writeWhole(
+            folder.logPath(), OrderLog::of(session, OrderLog::Layout::Plain, {}, failed, QDateTime()).write()));
         SessionState sending;
         sending.transfer.SugMishloah = Sending::Resend;
         EXPECT_EQ(TakeUpOrder({folder, *ReadOrderState(test.files, folder)}, sending, test.files),
@@ -192,6 +195,10 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
         EXPECT_EQ(sending.MisparHazmana, u"105");
         EXPECT_EQ(sending.shemot.n1, u"Dana Levi") << "what the report says is known until it is sent";
         EXPECT_TRUE(sending.handOver.lines.isEmpty());
+        ASSERT_EQ(sending.transfer.leftOut.size(), 2);
+        EXPECT_EQ(sending.transfer.leftOut[0].why, LeftOut::Why::Name);
+        EXPECT_EQ(sending.transfer.leftOut[1].why, LeftOut::Why::NotTold);
+        EXPECT_EQ(sending.transfer.leftOutAsked, way == Way::Http) << "its sending had begun";
     }
 }
 

@@ -1,4 +1,5 @@
 #include "order/OrderFolder.h"
+#include "order/OrderLog.h"
 #include "order/OrderState.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/OrderFiles.h"
@@ -28,32 +29,49 @@ class FtpFrmTest : public ::testing::Test, protected Line {};
 } // namespace
 
 TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
-    for (const auto& [careful, back] : {std::pair(false, false), {true, false}, {true, true}}) {
+    enum class Way { On, Back, Resend };
+    for (const auto& [careful, way] :
+         {std::pair(false, Way::On), {true, Way::On}, {true, Way::Back}, {true, Way::Resend}}) {
         Line line;
         SessionState& state = line.rig.state;
         state.Careful = careful;
         state.EnglishTips = 1;
+        OrderLog log;
+        log.Hazmana = FtpFrmRig::name();
+        log.shemot.n1 = u"Иван"_s;
+        log.shemot.TotalPics = 15;
+        log.failed = {u"C:\\a.jpg"_s, u"C:\\b.jpg"_s};
+        line.rig.write(FtpFrmRig::log(), log.write());
+        state.shemot = state.handOver.details = log.shemot;
         state.transfer.leftOut = {{u"C:\\a.jpg"_path}, {u"C:\\b.jpg"_path}};
         state.handOver.basket = {u"1 1015GNBC:\\a.jpg"_s};
+        if (way == Way::Resend) {
+            line.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::first(), FtpFrmRig::second()});
+            state.transfer.leftOut.clear();
+        }
         line.rig.chain.registerPage(PageId::kyoskNew, [] { return std::make_unique<Page>(PageId::kyoskNew); });
         FtpFrm& page = line.rig.start();
         const LeftOutControls& shown = page.controls().leftOut;
-        EXPECT_TRUE(shown.Pic4Hasserot.visible && shown.Command4Hazor.visible);
-        EXPECT_EQ(page.counting(), !careful) << "the count runs on behind the box";
+        const bool asks = way != Way::Resend;
+        const SendingPhase end = asks ? SendingPhase::Success : SendingPhase::AllThere; // a part goes again
+        EXPECT_EQ(shown.Pic4Hasserot.visible, asks);
+        EXPECT_EQ(page.counting(), !careful || !asks) << "the count runs on behind the box";
+        EXPECT_TRUE(page.controls().Picture2Lines.contains(u" Total pictures 13"_s)) << "15 were chosen";
         page.Image5_Click();
-        EXPECT_EQ(page.phase(), careful ? SendingPhase::Waiting : SendingPhase::Success);
-        EXPECT_EQ(shown.Command4Hazor.visible, careful) << "no way back once it is sent";
-        if (back) {
+        EXPECT_EQ(page.phase(), careful && asks ? SendingPhase::Waiting : end);
+        EXPECT_EQ(shown.Command4Hazor.visible, careful && asks) << "no way back once it is sent";
+        if (way == Way::Back) {
             page.Command4Hazor_Click();
             EXPECT_EQ(line.rig.chain.front()->id(), PageId::kyoskNew);
+            EXPECT_EQ(state.shemot.n1, log.shemot.n1) << "not as the log has it";
             EXPECT_TRUE(state.handOver.back && !line.rig.test.files.folderExists(FtpFrmRig::folder()));
             continue;
         }
         page.Command4Bli_Click();
         EXPECT_FALSE(shown.Pic4Hasserot.visible);
-        EXPECT_EQ(page.counting(), careful);
+        EXPECT_EQ(page.counting(), careful && asks);
         line.rig.countDown();
-        EXPECT_EQ(page.phase(), SendingPhase::Success);
+        EXPECT_EQ(page.phase(), end);
         EXPECT_EQ(shown.Label4Kartis.text, u"2 pictures that you chose are not in the order."_s);
         EXPECT_FALSE(page.controls().Label4Do.text.contains(u"whole"_s));
     }

@@ -19,13 +19,27 @@ struct UploadFormTest : ::testing::Test {
     UploadFormRig rig{lab};
 };
 
-TEST_F(UploadFormTest, CarefullyCountsOnceTheCustomerHasAnsweredAboutWhatWasLeftOut) {
-    rig.state.Careful = true;
-    rig.state.transfer.leftOut = {{u"C:\\a.jpg"_path, LeftOut::Why::Gone}};
-    UploadForm& page = rig.start();
-    EXPECT_TRUE(page.phase() == SendingPhase::Waiting && page.controls().leftOut.Pic4Hasserot.visible);
-    page.Command4Bli_Click();
-    EXPECT_TRUE(page.counting() && page.controls().leftOut.Label4Kartis.visible);
+TEST_F(UploadFormTest, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
+    for (const auto& [careful, again] : {std::pair(false, false), {true, false}, {true, true}}) {
+        rig.state.Careful = careful;
+        OrderLog log;
+        log.Hazmana = UploadFormRig::name();
+        log.failed = {u"C:\\a.jpg"_s};
+        rig.write(UploadFormRig::log(), log.write());
+        if (again)
+            rig.state.transfer.SugMishloah = Sending::Resend;
+        else
+            rig.state.transfer.leftOut = {{u"C:\\a.jpg"_path, LeftOut::Why::Gone}};
+        UploadForm& page = rig.start();
+        const LeftOutControls& shown = page.controls().leftOut;
+        EXPECT_TRUE(shown.Pic4Hasserot.visible == !again && shown.Label4Kartis.visible);
+        EXPECT_EQ(page.phase(), careful && !again ? SendingPhase::Waiting : SendingPhase::Countdown);
+        page.Command4Bli_Click();
+        EXPECT_TRUE(page.counting() && shown.Label4Kartis.visible);
+        rig.chain.unload(PageId::UploadForm);
+        rig.state.transfer.leftOut.clear();
+        rig.state.transfer.leftOutAsked = false;
+    }
 }
 
 TEST_F(UploadFormTest, EndsInTheStateThatTheFaultDeserves) {

@@ -3,6 +3,7 @@
 #include "order/CompletenessGuard.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
+#include "order/OrderLog.h"
 #include "order/OrderNames.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -43,15 +44,21 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
         if (page == this)
             QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
     });
-    // What an earlier order lacked says nothing of one that is sent again.
     if (state.transfer.SugMishloah != Sending::NewOrder)
-        state.transfer.leftOut.clear();
+        readLeftOut();
     // The window may be closed or the page unloaded inside a pump of a sending, which must not go on unseen.
     connect(&chain, &PageChain::ended, this, [this] { leave(); });
     connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
         if (page == this)
             leave();
     });
+}
+
+// The customer was asked when the order was new.
+void SendingPage::readLeftOut() {
+    const std::optional<OrderLog> log = ReadOrderLog(m_platform.files, OrderFolder::chosen(m_state));
+    m_state.transfer.leftOut = LeftOutOf(log ? log->failed : QStringList());
+    m_state.transfer.leftOutAsked = true;
 }
 
 // While the page before still runs a pump, clicks would not reach this page.

@@ -107,6 +107,8 @@ private:
     QString adviceOf(const PhaseLook& row) const;
     void goOnWithout();
     void goBack();
+    // What the log of an order that is sent again names as failed.
+    void readLeftOut();
     void activateWhenFree();
     void activate();
     void reportAgain();

@@ -119,6 +119,9 @@ void FtpFrm::refuseOrder() {
 void FtpFrm::armCountdown() {
     m_platform.pump.pump();
     countPictures();
+    // The log's total counts what was left out too.
+    if (!m_state.transfer.leftOut.isEmpty())
+        Picture2Lines = OrderSummaryLines(m_state, m_platform.clock.now().date());
     // The server is not asked: the lab may have removed the order's files.
     if (!lists().List3.isEmpty() && m_sender.onlyReportIsLeft()) {
         m_sender.beginOrder();
