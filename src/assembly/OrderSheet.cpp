@@ -1,6 +1,7 @@
 #include "assembly/OrderSheet.h"
 
 #include "assembly/WorkAhead.h"
+#include "common/AnsiCodePage.h"
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
 #include "session/SessionState.h"
@@ -246,9 +247,9 @@ void OrderSheet::drawLines(const QList<SheetLine>& lines) {
         for (const QString& part : QString(line.text).remove(u'\r').split(u'\n')) {
             const QFont font = fittingFont(part, room);
             QStringList pieces = {part};
+            const bool inLog = !line.onlyHere && AnsiCodePage::squeeze(part) == part;
             if (widthOf(part, font) > room)
-                pieces =
-                    line.onlyHere ? brokenToWidth(part, font, room) : QStringList{shortenedToWidth(part, font, room)};
+                pieces = inLog ? QStringList{shortenedToWidth(part, font, room)} : brokenToWidth(part, font, room);
             const int pitch = QFontMetrics(font).lineSpacing();
             for (qsizetype i = 0; i < pieces.size(); ++i)
                 placed.push_back({pieces[i], font, top + static_cast<int>(i) * pitch});

@@ -54,8 +54,8 @@ public:
     OrderSheet(SheetKind kind, PictureSize size, QColor background);
 
     // A line that is too long is drawn smaller, down to 8 pixels; what is longer still is shortened with "...", or
-    // broken where it is only here. Lines that reach the pictures make the sheet higher. To be called once, before the
-    // pictures.
+    // broken where it is only here or has a letter that the log's code page lacks. Lines that reach the pictures make
+    // the sheet higher. To be called once, before the pictures.
     void drawLines(const QList<SheetLine>& lines);
 
     // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, without the cells beyond them

@@ -177,6 +177,9 @@ TEST_F(ContactSheet, showsEachLineWholeAboveThePictures) {
         sheet.drawContactSheet({picture("land", 400, 300)}, [](int) { return true; });
         EXPECT_TRUE(isRed(sheet.bitmap().image().pixelColor(15, firstRow + 30)));
     }
+    OrderSheet sheet(SheetKind::Plain, {500, 480}, Qt::white);
+    sheet.drawLines({{u"Привет "_s.repeated(400)}});
+    EXPECT_GT(sheet.bitmap().image().height(), 480) << "the log would have question marks";
 }
 
 } // namespace
