@@ -61,8 +61,10 @@ struct Program::Parts {
         , platform{files, dialogs, line ? *line : internet, mail, shell, clock, pump, volume, instances} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
-            return dialogs.ask(state.wording(u"לצאת מהתוכנה? הזמנה שעדיין לא נשלחה לא תישמר.",
-                                             u"Leave the program? An order that was not sent yet is lost."));
+            const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);
+            return dialogs.ask(choosing ? state.wording(u"לצאת מהתוכנה? הזמנה שעדיין לא נשלחה לא תישמר.",
+                                                        u"Leave the program? An order that was not sent yet is lost.")
+                                        : state.wording(u"לצאת מהתוכנה?", u"Leave the program?"));
         };
     }
 
