@@ -188,30 +188,36 @@ EditorTable::EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent)
 }
 
 void EditorTable::render(const QString& said) {
-    const QSize room = size() - QSize(m_theme.px(20), m_theme.px(20));
-    const PictureSize paper = m_page.controls().PicPicSize;
-    const bool open = m_page.pictureOpen() && paper.width > 0 && paper.height > 0 && room.width() > 0;
-    m_paper->setVisible(open);
+    m_paper->setVisible(m_page.pictureOpen());
     if (m_words != said) {
         m_words = said;
         update();
     }
-    if (!open)
-        return;
-    const double scale = std::min(double(room.width()) / paper.width, double(room.height()) / paper.height);
-    const QSize fit(qRound(paper.width * scale), qRound(paper.height * scale));
-    const QRect place(QPoint((width() - fit.width()) / 2, (height() - fit.height()) / 2), fit);
-    if (m_paper->geometry() != place) {
-        m_paper->setGeometry(place);
+}
+
+PaperPlace EditorTable::place(int height, const std::optional<PanelForms>& panel) {
+    const PictureSize paper = m_page.controls().PicPicSize;
+    const int edge = m_theme.px(10);
+    const QSize room(width(), height);
+    if (!m_page.pictureOpen() || paper.width < 1 || paper.height < 1 || room.width() < 4 * edge || height < 4 * edge)
+        return {};
+    const QSizeF shape(paper.width, paper.height);
+    PaperPlace place;
+    if (panel)
+        place = placedBesidePanel(room, shape, edge, *panel);
+    if (place.paper.isEmpty())
+        place.paper = placedPaper(room, shape, edge);
+    if (m_paper->geometry() != place.paper) {
+        m_paper->setGeometry(place.paper);
         update();
     }
-    m_page.setPreviewScale(scale * devicePixelRatioF());
+    m_page.setPreviewScale(double(place.paper.width()) / paper.width * devicePixelRatioF());
     m_paper->render();
+    return place;
 }
 
 void EditorTable::resizeEvent(QResizeEvent*) {
-    if (m_page.pictureOpen())
-        render(m_words);
+    Q_EMIT resized();
 }
 
 void EditorTable::paintEvent(QPaintEvent*) {

@@ -2,9 +2,12 @@
 
 #include "editing/editor/tFrmNew.h"
 #include "views/kit/Theme.h"
+#include "views/tFrmNew/PaperPlace.h"
 
 #include <QEvent>
 #include <QWidget>
+
+#include <optional>
 
 namespace lumora {
 
@@ -46,8 +49,14 @@ public:
     EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent);
 
     EditorPaper& paper() const { return *m_paper; }
-    // Fits the paper into the table. words: what stands there while no picture is open.
+    // words: what stands there while no picture is open.
     void render(const QString& words);
+    // Fits the paper into so much of the table's height, beside the panel if there is one. Returns where the panel
+    // lies.
+    PaperPlace place(int height, const std::optional<PanelForms>& panel);
+
+Q_SIGNALS:
+    void resized();
 
 protected:
     void paintEvent(QPaintEvent* event) override;

@@ -36,6 +36,7 @@ tFrmNewView::tFrmNewView(tFrmNew& page, PageChain& chain, const SessionState& st
     frame().content()->setSpacing(theme.size(Space::Small));
     m_nearTools = makeTools();
     m_table = new EditorTable(page, theme, this);
+    connect(m_table, &EditorTable::resized, this, &tFrmNewView::placePanels);
     bind(u"PicPic"_s, &m_table->paper(), [this] { return c.Title.text; });
     bindName(m_table->paper().captionBox(), c.Labeltext);
     m_farTools = makeFramesAndMore();
@@ -96,9 +97,9 @@ ToolButton* tFrmNewView::colour(int index, const QString& icon, QColor ink) {
 
 QWidget* tFrmNewView::makeTools() {
     QFrame* place = group(c.placeTitle, {makePlace()});
-    QFrame* turns = group(c.turnTitle, {makeTurns()});
     QFrame* light = group(c.lightTitle, {makeLight()});
-    QWidget* box = inBox(inColumn(Space::Small, {place, turns, light, Item::room()}));
+    QFrame* turns = group(c.turnTitle, {makeTurns()});
+    QWidget* box = inBox(inColumn(Space::Small, {place, light, turns, Item::room()}));
     box->setFixedWidth(theme().px(columnWidth));
     return box;
 }
@@ -288,7 +289,9 @@ void tFrmNewView::render() {
     m_help->setVisible(uncovered); // a panel would cover the button that closes the hints
     m_undo->setVisible(c.Picture3.visible);
     m_name->setText(fromLeft(m_name->fontMetrics().elidedText(c.Title.text, Qt::ElideMiddle, theme().px(260))));
-    m_operator->setVisible(state().DegelEdit);
+    m_operator->setVisible(uncovered && state().DegelEdit);
+    if (!uncovered)
+        m_operatorPanel->hide();
     m_resolution->display(c.resolution);
     m_table->render(c.Image19.visible ? c.Image19.text : QString());
     placePanels();

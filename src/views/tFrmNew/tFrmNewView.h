@@ -2,11 +2,13 @@
 
 #include "editing/editor/tFrmNew.h"
 #include "selection/FolderPager.h"
+#include "views/tFrmNew/PaperPlace.h"
 #include "views/window/HoldingView.h"
 
 #include <QPointer>
 
 #include <array>
+#include <optional>
 
 namespace lumora {
 
@@ -62,6 +64,7 @@ private:
 
     void renderStrip();
     void renderHints();
+    std::optional<PanelForms> turnForms() const;
     void placePanels();
     void listenToPictures();
 
@@ -89,6 +92,7 @@ private:
     QPushButton* m_next = nullptr;
     QFrame* m_tonePanel = nullptr;
     QFrame* m_turnPanel = nullptr;
+    QBoxLayout* m_turns = nullptr; // the buttons of the panel, in a row or in a column
     QFrame* m_operatorPanel = nullptr;
     QWidget* m_palette = nullptr;
     std::vector<std::pair<QLabel*, const Caption*>> m_hintLines;

@@ -114,7 +114,8 @@ void tFrmNewView::makeTurnPanel() {
     bindName(m_angle, c.Label10);
     auto* right = turn(c.Image16, u"turn-right"_s, &tFrmNew::Image16_MouseDown, &tFrmNew::Image16_MouseUp);
     auto* upright = tool(c.Image27, u"upright"_s, inPanel, &tFrmNew::Image27_Click);
-    panel.column->addLayout(inRow(Space::Tight, {quarter, left, m_angle, right, upright}));
+    m_turns = inRow(Space::Tight, {quarter, left, m_angle, right, upright});
+    panel.column->addLayout(m_turns);
     m_turnPanel = panel.frame;
     m_turnPanel->setLayoutDirection(Qt::LeftToRight); // left is left in both languages
     bind(m_turnPanel, c.Frame4);
@@ -133,30 +134,39 @@ void tFrmNewView::makeOperatorPanel() {
     frame().addHeaderAction(m_operator);
 
     const auto plain = [&](const Caption& caption, Click clicked) { return button(caption, Role::Plain, clicked); };
+    const auto small = [&](const Caption& caption, const QString& icon, Click clicked) {
+        auto* made = new ToolButton(theme(), icon, inPanel, this);
+        connect(made, &QPushButton::clicked, this, toPage(clicked));
+        bind(made, caption);
+        return made;
+    };
     QLayout* sizes = inRow(
         Space::Small, {plain(c.Command24, &tFrmNew::Command24_Click), plain(c.Command12, &tFrmNew::Command12_Click),
-                       plain(c.Command10, &tFrmNew::Command10_Click), plain(c.Command23, &tFrmNew::Command23_Click),
-                       plain(c.Command4, &tFrmNew::Command4_Click), plain(c.Command2, &tFrmNew::Command2_Click),
-                       plain(c.Command6, &tFrmNew::Command6_Click)});
+                       plain(c.Command10, &tFrmNew::Command10_Click), plain(c.Command23, &tFrmNew::Command23_Click)});
     m_palette = new Palette(m_page, m_operatorPanel);
     bind(u"pic4Msgrt"_s, m_palette, [this] { return c.Label4.text; });
     m_lineStyles = comboBox(c.Combo5List, c.Combo5, toPage(&tFrmNew::Combo5_Click));
-    QLayout* lines = inRow(Space::Small, {m_palette, m_lineStyles, plain(c.Command18, &tFrmNew::Command18_Click),
-                                          plain(c.Command9, &tFrmNew::Command9_Click)});
     auto* bar = new QSlider(Qt::Horizontal, m_operatorPanel);
     bar->setRange(tFrmNewControls::VScrollZMin, tFrmNewControls::VScrollZMax);
     bar->setMinimumHeight(theme().target());
     bar->setValue(c.VScrollZ);
     connect(bar, &QSlider::valueChanged, this, toPage(&tFrmNew::VScrollZ_Change));
     bind(u"VScrollZ"_s, bar, [this] { return QString::number(c.VScrollZ); });
-    QLayout* crop = inRow(Space::Small, {plain(c.Command14, &tFrmNew::Command14_Click),
-                                         plain(c.Command13, &tFrmNew::Command13_Click),
-                                         plain(c.Command16, &tFrmNew::Command16_Click),
-                                         plain(c.Command15, &tFrmNew::Command15_Click),
-                                         {bar, 1}});
+    QLayout* upper = inRow(Space::Tight, {small(c.Command2, u"folder"_s, &tFrmNew::Command2_Click),
+                                          small(c.Command4, u"look"_s, &tFrmNew::Command4_Click),
+                                          small(c.Command6, u"lighter"_s, &tFrmNew::Command6_Click),
+                                          small(c.Command18, u"arrow-up"_s, &tFrmNew::Command18_Click),
+                                          small(c.Command9, u"arrow-down"_s, &tFrmNew::Command9_Click)});
+    QLayout* lower = inRow(Space::Tight, {small(c.Command14, u"frame"_s, &tFrmNew::Command14_Click),
+                                          small(c.Command13, u"frame"_s, &tFrmNew::Command13_Click),
+                                          small(c.Command16, u"plus"_s, &tFrmNew::Command16_Click),
+                                          small(c.Command15, u"minus"_s, &tFrmNew::Command15_Click),
+                                          {m_lineStyles, 1}});
     QLabel* record = label(c.Label13, "small");
     record->setLayoutDirection(Qt::LeftToRight);
-    add(*panel.column, {sizes, lines, crop, record});
+    add(*panel.column,
+        {sizes, inRow(Space::Small, {{m_palette, 0, Qt::AlignCenter}, {inColumn(Space::Tight, {upper, lower}), 1}}),
+         bar, record});
 }
 
 // --- the hints in words, for who can't hover ---
@@ -186,27 +196,55 @@ void tFrmNewView::renderHints() {
 
 // --- where they stand ---
 
-// Beside the button that opens them, over the table; the operator's over the small pictures.
+// The room of the panel is kept also while it is closed, so that the paper does not move under the pointer. The
+// keyboard takes the tools away, and the panel with them.
+std::optional<PanelForms> tFrmNewView::turnForms() const {
+    if (m_nearTools->isHidden())
+        return std::nullopt;
+    PanelForms forms;
+    for (int i = 0; i < m_turns->count(); ++i) {
+        // A layout takes no size from the widgets of a panel that has never been shown.
+        const QWidget& part = *m_turns->itemAt(i)->widget();
+        const QSize hint = part.sizeHint().expandedTo(part.minimumSize());
+        forms.row = {forms.row.width() + hint.width(), std::max(forms.row.height(), hint.height())};
+        forms.column = {std::max(forms.column.width(), hint.width()), forms.column.height() + hint.height()};
+    }
+    const QMargins margins = m_turnPanel->layout()->contentsMargins() + m_turnPanel->contentsMargins();
+    const QSize around(margins.left() + margins.right(), margins.top() + margins.bottom());
+    const int gaps = m_turns->spacing() * (m_turns->count() - 1);
+    forms.row += around + QSize(gaps, 0);
+    forms.column += around + QSize(0, gaps);
+    const QPoint opener = m_turn->mapTo(this, m_turn->rect().center()) - m_table->mapTo(this, QPoint());
+    forms.level = opener.y();
+    forms.atLeft = opener.x() < 0;
+    return forms;
+}
+
+// The operator's tools lie over the small pictures, the turns beside the paper, the tones over the table beside their
+// button.
 void tFrmNewView::placePanels() {
-    if (!m_operatorPanel)
+    if (!m_operatorPanel || isDetached())
         return;
-    const QRect table(m_table->mapTo(this, QPoint()), m_table->size());
-    const auto beside = [&](QFrame& panel, const QWidget& opener) {
-        const QSize size = panel.sizeHint();
-        const int level = opener.mapTo(this, QPoint(0, opener.height() / 2)).y();
-        const bool fromLeft = opener.mapTo(this, QPoint()).x() < table.center().x();
-        const int x = fromLeft ? table.left() : table.right() + 1 - size.width();
-        const int y = std::clamp(level - size.height() / 2, table.top(), table.bottom() - size.height());
-        panel.setGeometry(x, y, size.width(), size.height());
-        panel.raise();
-    };
-    beside(*m_tonePanel, *m_tones);
-    beside(*m_turnPanel, *m_turn);
-    const QSize size = m_operatorPanel->sizeHint();
+    const QPoint corner = m_table->mapTo(this, QPoint());
     const int bottom = m_strip->mapTo(this, QPoint(0, m_strip->height())).y();
-    m_operatorPanel->setGeometry((width() - size.width()) / 2, bottom - size.height(), size.width(), size.height());
+    const QSize wanted = m_operatorPanel->sizeHint();
+    const QSize size(std::max(wanted.width(), m_table->width()), wanted.height());
+    m_operatorPanel->setGeometry(corner.x() + (m_table->width() - size.width()) / 2, bottom - size.height(),
+                                 size.width(), size.height());
     m_operatorPanel->raise();
     m_palette->update();
+    const int free = m_operatorPanel->isHidden() ? m_table->height() : m_operatorPanel->y() - corner.y();
+    const PaperPlace turns = m_table->place(free, turnForms());
+    m_turns->setDirection(turns.column ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
+    m_turnPanel->setGeometry(turns.panel.translated(corner));
+    m_turnPanel->raise();
+    const QSize tones = m_tonePanel->sizeHint();
+    const bool atLeft = m_tones->mapTo(this, QPoint()).x() < corner.x();
+    const int level = m_tones->mapTo(this, m_tones->rect().center()).y() - tones.height() / 2;
+    m_tonePanel->setGeometry(atLeft ? corner.x() : corner.x() + m_table->width() - tones.width(),
+                             std::clamp(level, corner.y(), corner.y() + m_table->height() - tones.height()),
+                             tones.width(), tones.height());
+    m_tonePanel->raise();
     if (m_hints->isOpen())
         m_hints->raise();
 }
