@@ -111,7 +111,7 @@ class Workspace:
 
     def told(self):
         """How the sending ended in the program's words: arrived, there (without reports), not."""
-        if 'whole order has arrived' in self.said:
+        if 'whole order has arrived' in self.said or 'Your order has arrived' in self.said:    # the lab told, or perhaps not
             return 'arrived'
         return 'there' if 'are on the server' in self.said else 'not'
 

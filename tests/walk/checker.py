@@ -9,7 +9,8 @@ import pathlib
 import zlib
 
 SENDING = ('FtpFrm', 'UploadForm')
-ARRIVED = ('כל ההזמנה הגיעה', 'The whole order has arrived', 'מה שבהזמנה הגיע', 'What is in the order has arrived')
+ARRIVED = ('כל ההזמנה הגיעה', 'The whole order has arrived', 'מה שבהזמנה הגיע', 'What is in the order has arrived',
+           'ההזמנה הגיעה, ולא ידוע', 'Your order has arrived')
 NOT_TYPED = 'לא הוקלד'
 GLOSSY, MATTE = ('מבריק', 'Glossy'), ('מט', 'Matte')
 BORDERS = {'ללא מסגרת': 'NB', 'No border': 'NB', 'מסגרת לבנה': 'WB', 'White border': 'WB'}
