@@ -126,7 +126,9 @@ TEST_F(AReport, thatNoAnswerCameToStaysBegunCarefully) {
     calls.answered = false;
     for (const bool careful : {true, false}) {
         state.Careful = careful;
-        ASSERT_TRUE(WriteOrderState(test.files, folder, {.phase = Phase::Arrived}));
+        OrderState before;
+        before.phase = Phase::Arrived;
+        ASSERT_TRUE(WriteOrderState(test.files, folder, before));
         OrderJournal journal(test.files, folder);
         ReportOnce(state, test.files, journal, stop).tell(Sender::Ftp, calls);
         EXPECT_EQ(kept().report, careful ? Report::Begun : Report::Done);
