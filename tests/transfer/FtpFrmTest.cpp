@@ -53,7 +53,7 @@ TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
         FtpFrm& page = line.rig.start();
         const LeftOutControls& shown = page.controls().leftOut;
         const bool asks = way != Way::Resend;
-        const SendingPhase end = asks ? SendingPhase::Success : SendingPhase::AllThere; // a part goes again
+        const SendingPhase end = asks ? SendingPhase::Success : SendingPhase::PartThere;
         EXPECT_EQ(shown.Pic4Hasserot.visible, asks);
         EXPECT_EQ(page.counting(), !careful || !asks) << "the count runs on behind the box";
         EXPECT_TRUE(page.controls().Picture2Lines.contains(u" Total pictures 13"_s)) << "15 were chosen";
@@ -73,7 +73,7 @@ TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
         line.rig.countDown();
         EXPECT_EQ(page.phase(), end);
         EXPECT_EQ(shown.Label4Kartis.text, u"2 pictures that you chose are not in the order."_s);
-        EXPECT_FALSE(page.controls().Label4Do.text.contains(u"whole"_s));
+        EXPECT_FALSE(page.controls().Label4Do.text.contains(u"whole order has"_s));
     }
 }
 
