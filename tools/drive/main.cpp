@@ -1,11 +1,10 @@
 #include "app/Program.h"
+#include "drive/NothingOpens.h"
 #include "drive/RandomWalk.h"
 #include "drive/ScenarioPlayer.h"
 #include "views/window/Application.h"
 
 #include <QCommandLineParser>
-#include <QDesktopServices>
-#include <QUrl>
 
 #include <cstdio>
 #include <cstdlib>
@@ -39,26 +38,6 @@ int startFailure(const Result<void>& started) {
     return complain(started.failure().message,
                     started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notPlayed);
 }
-
-// Takes what a page would open outside the program.
-class NothingOpens : public QObject {
-    Q_OBJECT
-public:
-    NothingOpens() {
-        for (const QString& scheme : schemes)
-            QDesktopServices::setUrlHandler(scheme, this, "take");
-    }
-    ~NothingOpens() override {
-        for (const QString& scheme : schemes)
-            QDesktopServices::unsetUrlHandler(scheme);
-    }
-
-public Q_SLOTS:
-    void take(const QUrl&) {}
-
-private:
-    const QStringList schemes{u"http"_s, u"https"_s, u"file"_s, u"mailto"_s};
-};
 
 // The walk goes on where the customer has ended the program and starts it again.
 int walk(RandomWalk& walk, const ProgramOptions& options) {
@@ -145,5 +124,3 @@ int play(int argc, char** argv) {
 int main(int argc, char** argv) {
     return play(argc, argv);
 }
-
-#include "main.moc"
