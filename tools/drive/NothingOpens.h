@@ -1,8 +1,6 @@
 #pragma once
 
-#include <QDesktopServices>
 #include <QObject>
-#include <QStringList>
 #include <QUrl>
 
 namespace lumora {
@@ -11,21 +9,11 @@ namespace lumora {
 class NothingOpens : public QObject {
     Q_OBJECT
 public:
-    NothingOpens() {
-        for (const QString& scheme : m_schemes)
-            QDesktopServices::setUrlHandler(scheme, this, "take");
-    }
-    ~NothingOpens() override {
-        for (const QString& scheme : m_schemes)
-            QDesktopServices::unsetUrlHandler(scheme);
-    }
+    NothingOpens();
+    ~NothingOpens() override;
 
 public Q_SLOTS:
     void take(const QUrl&) {}
-
-private:
-    const QStringList m_schemes{QStringLiteral("http"), QStringLiteral("https"), QStringLiteral("file"),
-                                QStringLiteral("mailto")};
 };
 
 } // namespace lumora
