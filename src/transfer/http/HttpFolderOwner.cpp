@@ -51,9 +51,7 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
     const QString log = order.folder().logPath().leaf();
     if (std::none_of(answer.files->begin(), answer.files->end(),
                      [&](const QString& name) { return isSame(name, log); }))
-        return posted                                                    ? Owner::Unclaimed
-               : order.wasSentBefore() && isPartOf(order, *answer.files) ? Owner::Ours
-                                                                         : Owner::Foreign;
+        return posted ? Owner::Unclaimed : ownerWithoutLog(order, *answer.files);
     switch (logThere(order, *answer.files, uploads)) {
     case Log::Same:
         return Owner::Ours;
@@ -70,10 +68,10 @@ HttpFolderOwner::Owner HttpFolderOwner::of(const OrderJournal& order, const Serv
 }
 
 // An older version posted the log last.
-bool HttpFolderOwner::isPartOf(const OrderJournal& order, const QStringList& names) const {
+HttpFolderOwner::Owner HttpFolderOwner::ownerWithoutLog(const OrderJournal& order, const QStringList& names) const {
     const QStringList own = m_platform.files.names(order.folder().path(), u"*"_s);
-    return std::all_of(names.begin(), names.end(),
-                       [&](const QString& name) { return own.contains(name, Qt::CaseInsensitive); });
+    const auto isOwn = [&](const QString& name) { return own.contains(name, Qt::CaseInsensitive); };
+    return order.wasSentBefore() && std::all_of(names.begin(), names.end(), isOwn) ? Owner::Ours : Owner::Foreign;
 }
 
 bool HttpFolderOwner::isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const {

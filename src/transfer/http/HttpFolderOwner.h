@@ -36,7 +36,7 @@ public:
     bool isReplaced(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
 
 private:
-    bool isPartOf(const OrderJournal& order, const QStringList& names) const;
+    Owner ownerWithoutLog(const OrderJournal& order, const QStringList& names) const;
     enum class Log { Same, Part, Other, Withheld, NotKnown };
     Log logThere(const OrderJournal& order, const QStringList& entries, const QString& uploads) const;
 

@@ -468,14 +468,18 @@ bool HttpSender::onlyReportIsLeft() const {
     return m_state.transfer.SugMishloah == Sending::NewOrder && m_journal && m_journal->state().onlyReportIsLeft();
 }
 
+Arrival HttpSender::arrival() const {
+    return lacking() ? Arrival::Agreed : Arrival::Whole;
+}
+
 void HttpSender::keepArrival(SendingPhase end) {
-    report.keepArrival(lacking() ? Arrival::Agreed : Arrival::Whole, end, m_arrival.byNameOnly());
+    report.keepArrival(arrival(), end, m_arrival.byNameOnly());
 }
 
 bool HttpSender::keepFoundThere() {
-    const bool fewer = lacking().has_value();
-    report.keepArrival(fewer ? Arrival::Agreed : Arrival::Whole, SendingPhase::Success, m_arrival.byNameOnly());
-    const bool due = !fewer && report.isDueWhereFound();
+    const Arrival found = arrival();
+    report.keepArrival(found, SendingPhase::Success, m_arrival.byNameOnly());
+    const bool due = found == Arrival::Whole && report.isDueWhereFound();
     if (!due)
         report.endUntold();
     return due;

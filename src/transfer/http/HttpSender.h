@@ -112,6 +112,7 @@ private:
     void compare(int listNumber);
     bool isEntered() const; // the folder needs no further question whose it is
     void claimFolder();
+    Arrival arrival() const; // where all files of the folder have arrived
     void lookForAnother();
     SendingPhase endLost();
     bool stopped() const { return m_stop.left || m_stop.StopFlag; }
