@@ -255,6 +255,7 @@ void RandomWalk::pageShown(const QString& page) {
 void RandomWalk::stop(const QString& why) {
     if (m_over)
         return;
+    keepPaper(nullptr, {});
     write({{u"end"_s, why.isEmpty() ? u"the order has come to its end"_s : why}});
     m_failure = why;
     m_over = true;
@@ -287,11 +288,15 @@ QJsonObject RandomWalk::seen(const PageView& view) {
     return {{u"shown"_s, shown}, {u"marked"_s, marked}, {u"words"_s, words}};
 }
 
-// What the editor shows of a picture stays under the line that told of it.
-void RandomWalk::keepPaper(const PageView& view) {
-    auto* paper = view.findChild<QWidget*>(u"PicPic"_s);
-    if (paper && paper->isVisible())
-        paper->grab().save(QDir(m_plan.record).filePath(u"preview.%1.png"_s.arg(m_line)));
+// What the editor showed last of a picture stays under the line that told of it.
+void RandomWalk::keepPaper(const PageView* view, const QString& title) {
+    auto* paper = view ? view->findChild<QWidget*>(u"PicPic"_s) : nullptr;
+    const bool isShown = paper && paper->isVisible();
+    if (!m_paper.isNull() && (!isShown || title != m_title))
+        m_paper.save(QDir(m_plan.record).filePath(u"preview.%1.png"_s.arg(m_paperLine)), "PNG", 89);
+    m_title = title;
+    m_paper = isShown ? paper->grab() : QPixmap();
+    m_paperLine = m_line;
 }
 
 // Links are enough: the program replaces files as a whole.
@@ -404,8 +409,7 @@ void RandomWalk::perform(Act act) {
     line.insert(u"act"_s, act.line);
     line.insert(u"page"_s, m_front);
     write(line);
-    if (view)
-        keepPaper(*view);
+    keepPaper(view, line[u"shown"_s][u"Title"_s].toString());
     if (++m_acts == m_plan.presses)
         write({{u"ending"_s, true}});
     m_pressAfter = draw(6) == 0 ? 1 + draw(300) : 0;

@@ -7,6 +7,7 @@
 #include <QFile>
 #include <QJsonObject>
 #include <QObject>
+#include <QPixmap>
 #include <QSet>
 #include <QStringList>
 #include <QTimer>
@@ -27,7 +28,7 @@ class Program;
 // seen.jsonl has an object a line. "act" is a press as a scenario says it, with "page", "shown" (text by control),
 // "marked" (controls that are ticked) and "words" (labels without a name), all from before the press; "front" is a page
 // that came to the front, "said" a box or a question. Beside it "<n>" holds the order folders of the moment when line n
-// told of a page, and "preview.<n>.png" the editor's paper.
+// told of a page, and "preview.<n>.png" the editor's paper as it was last before another picture.
 class RandomWalk : public QObject {
     Q_OBJECT
 public:
@@ -73,7 +74,7 @@ private:
     void pageShown(const QString& page);
     void write(QJsonObject line);
     QJsonObject seen(const PageView& view);
-    void keepPaper(const PageView& view);
+    void keepPaper(const PageView* view, const QString& title);
     void keepOrders();
     void stop(const QString& why);
 
@@ -93,6 +94,9 @@ private:
     QElapsedTimer m_sinceAct;
     QFile m_file;
     int m_line = 0;
+    QString m_title; // what the page in front says of its picture
+    QPixmap m_paper; // the editor's, as the line m_paperLine told it
+    int m_paperLine = 0;
     int m_acts = 0;
     int m_pressAfter = 0;       // milliseconds of work until a press in the middle of it; 0: none
     bool m_acting = false;      // the handler of a press has not returned
