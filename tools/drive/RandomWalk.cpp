@@ -44,7 +44,7 @@ const QStringList telephones = {u"03-1234567"_s, u"052-7654321"_s, u"+972-52-765
                                 u"02 6543210 / 17"_s};
 const QStringList addresses = {u"הרצל 5, תל אביב"_s, u"12 Long Street, Haifa 3312345"_s};
 const QStringList mailNames = {u"dana"_s, u"ruth.cohen@example.com"_s};
-const QStringList domains = {u"example.com"_s, u"walla.co.il"_s};
+const QStringList domains = {u"example.com"_s, u"example.org"_s};
 const QStringList notes = {u"מתנה לסבתא"_s, u"Please call first"_s, QString(70, u'ש') + u" 12"_s};
 
 const std::vector<std::pair<QString, const QStringList*>> typed = {
