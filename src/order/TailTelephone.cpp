@@ -16,11 +16,7 @@ bool TailTelephone::mayGoOnWith(const QString& typed, Dialogs& dialogs) const {
     const QString number = AnsiCodePage::squeeze(of(typed.trimmed()));
     if (!m_state.Careful || number.size() <= width)
         return true;
-    return dialogs.ask(m_state
-                           .wording(u"מספר הטלפון ארוך מעשרה תווים. עם התמונות יירשם רק: %1\nלהמשיך כך?",
-                                    u"The telephone number has more than ten characters. Only this goes with the "
-                                    "pictures: %1\nGo on with it?")
-                           .arg(number.left(width)));
+    return dialogs.ask(question(number.left(width)));
 }
 
 QString TailTelephone::squeezed(const QString& typed) {

@@ -26,6 +26,8 @@ public:
     static QString squeezed(const QString& typed);
 
 private:
+    QString question(const QString& kept) const;
+
     const SessionState& m_state;
 };
 
