@@ -3,6 +3,7 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/files/PictureFile.h"
 #include "order/OrderCheck.h"
+#include "order/OrderState.h"
 #include "support/JpegQuality.h"
 #include "support/SmallDisk.h"
 
@@ -49,7 +50,6 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(*readPictureSize(host(jobFolder / u"12~תמונה 01.bmp")), (PictureSize{300, 450}));
     EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path)) << "goes at the end of each step";
     EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
-    EXPECT_EQ(state.transfer.OrderLogBase.text() + u".txt"_s, logPath().text());
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
@@ -184,17 +184,21 @@ TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
     expectColour(sheet, {169 + 40, 161 + 26}, Qt::white);
 }
 
-TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
+TEST_F(PreparingAnEditedOrder, savesSheetTailAndWayAsTheirReceiverWantsThem) {
     const QString jpp = u"!105_1234.jpp"_s, jpg = u"!105_1234.jpg"_s;
-    const QString picture = edited(givePicture(u"one_1.jpg"_s));
-    for (const auto& [sender, local, sheets, next, messages] :
-         std::initializer_list<std::tuple<Sender, bool, QStringList, PageId, int>>{
-             {Sender::Ftp, false, {jpp}, PageId::FtpFrm, 0},
-             {Sender::Ftp, true, {jpg, jpp}, PageId::hatchala, 0},
-             {Sender::Http, true, {jpg}, PageId::hatchala, 0},
-             {Sender::Http, false, {jpg}, PageId::hatchala, 1}, // no page to go on with
-             {Sender::Http, false, {jpg}, PageId::UploadForm, 0}}) {
-        SCOPED_TRACE(static_cast<int>(next));
+    const QString path = givePicture(u"one_1.jpg"_s);
+    const QByteArray tail = "1 1 03-1234567Dana Levi 1  1051234      ";
+    using Way = OrderState::Way;
+    state.SugTzad = 60;
+    for (const auto& [edits, sender, local, sheets, way, next, messages] :
+         std::initializer_list<std::tuple<bool, Sender, bool, QStringList, Way, PageId, int>>{
+             {true, Sender::Ftp, false, {jpp}, Way::Ftp, PageId::FtpFrm, 0},
+             {true, Sender::Ftp, true, {jpg, jpp}, Way::Station, PageId::hatchala, 0},
+             {true, Sender::Http, true, {jpg}, Way::Station, PageId::hatchala, 0},
+             {true, Sender::Http, false, {jpg}, Way::Http, PageId::hatchala, 1}, // no page to go on with
+             {true, Sender::Http, false, {jpg}, Way::Http, PageId::UploadForm, 0},
+             {false, Sender::Http, false, {jpp}, Way::Ftp, PageId::FtpFrm, 0}}) { // its sheet and its sender are FTP's
+        SCOPED_TRACE(edits ? static_cast<int>(next) : -1);
         state.MisparHazmana = u"105"_s;
         state.transfer.SugSheliach = sender;
         state.TachanaMekomit = local;
@@ -202,9 +206,13 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
         machine.dialogs.messages.clear();
         if (next == PageId::UploadForm)
             registerBare({PageId::UploadForm});
-        prepare({picture});
+        start(openEither(edits, {edits ? edited(path) : line(path)}));
         EXPECT_EQ(machine.files.names(folder(), u"!*"_s), sheets);
         EXPECT_EQ(checkOrderFolder(host(folder()), {56, 30})->faults, QStringList());
+        const Result<PrintFileContent> made = unpacked(printFiles().value(0));
+        ASSERT_TRUE(made);
+        EXPECT_EQ(made->tail, edits ? tail : tail + "^one_1              ") << "an edited order's is always short";
+        EXPECT_EQ(ReadOrderState(machine.files, OrderFolder(folder()))->way, way);
         EXPECT_EQ(front(), next);
         EXPECT_EQ(state.handOver.notice.contains(u"105"_s), next == PageId::hatchala);
         EXPECT_EQ(machine.dialogs.messages.size(), messages);
@@ -213,33 +221,36 @@ TEST_F(PreparingAnEditedOrder, savesTheSheetAsItsReceiverWantsIt) {
     }
 }
 
-TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLogAndCarefullyNotWithoutSheetOrPrints) {
-    const QString good = edited(givePicture(u"one_1.jpg"_s)), bad = edited(giveFile(u"bad_1.jpg"_s, "no picture"));
+TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLogAndCarefullyNotWithoutSheetOrPrintsAsAPlainOneToo) {
+    const QString good = givePicture(u"one_1.jpg"_s), bad = giveFile(u"bad_1.jpg"_s, "no picture");
     const struct {
         bool careful;
         DrivePath blocked;
-        QString item;
-        PageId front;
-    } cases[] = {{false, logPath(), good, PageId::B3},
-                 {false, folder() / u"!105_1234.jpp", good, PageId::FtpFrm},
-                 {true, folder() / u"!105_1234.jpp", good, PageId::B3},
-                 {false, {}, bad, PageId::FtpFrm},
-                 {true, {}, bad, PageId::B3},
-                 {true, {}, good, PageId::FtpFrm}};
-    for (const auto& c : cases) {
-        SCOPED_TRACE(&c - cases);
-        state.Careful = c.careful;
-        B3& page = open({c.item});
-        onceClaimed([&] {
-            if (!c.blocked.isEmpty())
-                makeFolder(c.blocked);
-        });
-        page.Timer2_Tick();
-        EXPECT_EQ(front(), c.front);
-        EXPECT_EQ(printFiles().size(), c.item == good ? 1 : 0);
-        chain.unload(front());
-        std::filesystem::remove_all(host(folder()));
-        state.MisparHazmana = u"105"_s;
+        QString picture;
+        bool isSent;
+    } cases[] = {{false, logPath(), good, false},
+                 {false, folder() / u"!105_1234.jpp", good, true},
+                 {true, folder() / u"!105_1234.jpp", good, false},
+                 {false, {}, bad, true},
+                 {true, {}, bad, false},
+                 {true, {}, good, true}};
+    for (const bool edits : {true, false}) {
+        for (const auto& c : cases) {
+            SCOPED_TRACE(&c - cases);
+            state.Careful = c.careful;
+            PreparationPage& page = openEither(edits, {edits ? edited(c.picture) : line(c.picture)});
+            onceClaimed([&] {
+                if (!c.blocked.isEmpty())
+                    makeFolder(c.blocked);
+            });
+            start(page);
+            EXPECT_EQ(front(), c.isSent ? PageId::FtpFrm : edits ? PageId::B3 : PageId::Form2);
+            const bool begun = edits || c.isSent || c.blocked == logPath(); // a plain order's sheet comes first
+            EXPECT_EQ(printFiles().size(), c.picture == good && begun ? 1 : 0);
+            chain.unload(front());
+            std::filesystem::remove_all(host(folder()));
+            state.MisparHazmana = u"105"_s;
+        }
     }
 }
 

@@ -49,6 +49,7 @@ protected:
     }
     // The page of either kind of order, and its start.
     PreparationPage& openEither(bool edits, const QStringList& items) {
+        state.Optint = edits ? OrderKind::EditedPrint : OrderKind::Print;
         return edits ? static_cast<PreparationPage&>(open(items)) : openWith(items);
     }
     static void start(PreparationPage& page) {

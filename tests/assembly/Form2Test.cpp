@@ -247,15 +247,6 @@ TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) 
 TEST_F(PreparingAPlainOrder, goesOnWithoutAPrintAndTheCounterButNotWithoutTheLog) {
     const QString one = givePicture(u"one.jpg"_s);
     const DrivePath print = folder() / u"1 1015GNB0000_016F6E65.jpp";
-    const DrivePath sheet = folder() / u"!105_1234.jpp";
-    state.Careful = true;
-    onceClaimed([&] { makeFolder(sheet); });
-    openWith({line(one)}).Command6_Click();
-    EXPECT_EQ(front(), PageId::Form2) << "carefully not without its sheet either";
-    chain.unload(PageId::Form2);
-    std::filesystem::remove_all(host(folder()));
-    machine.dialogs.messages.clear();
-    state.Careful = false;
     makeFolder(u"C:\\vedron\\mispar.txt"_s);
     Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
     onceClaimed([&] {

@@ -12,7 +12,6 @@ protected:
     // Prepares an order, and puts back what a kill during its third picture would have left. The next order's clean-up
     // has run.
     void prepareAndKill(bool edits, const QStringList& items) {
-        state.Optint = edits ? OrderKind::EditedPrint : OrderKind::Print;
         const HostPath aside = host(u"C:\\aside"_s);
         fs::remove_all(aside);
         PreparationPage& page = openEither(edits, items);
@@ -67,8 +66,6 @@ TEST_F(GoingOnWithAnOrder, MakesTheSameOrderAndNoPrintTwice) {
             items += edits ? edited(path, record(path == paths[3] ? redEyesCorrected : toned)) : line(path);
         state = exampleOrder();
         state.DiskRoot = machine.drives.programRoot();
-        state.profile.JppBase = 30;
-        state.profile.JppChunks = 56;
         prepareAndKill(edits, items);
         fs::remove(host(paths[0])); // its print is there
         if (edits) {                // between print and thumbnail

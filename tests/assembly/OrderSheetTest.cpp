@@ -65,7 +65,7 @@ TEST(OrderSheet, tellsAnEditedOrderInItsOwnSixLines) {
     EXPECT_EQ(orderSheetBackground(SheetKind::Edited, state), QColor(Qt::white));
 }
 
-TEST(OrderSheet, tellsAnAlbumInEighteenEntries) {
+TEST(OrderSheet, tellsAnAlbumInSeventeenLines) {
     SessionState state = deliveredOrder();
     AlbumDetails& album = state.album;
     album.ShemZalam = u"Studio Or"_s;
@@ -137,6 +137,22 @@ TEST_F(ContactSheet, laysEveryPictureInLandscapeATurnedOneClockwise) {
         EXPECT_TRUE(isBlue(image.pixelColor(blue))) << blue.x();
     }
     EXPECT_EQ(image.pixelColor(87 + 10, 160), QColor(Qt::white));
+}
+
+TEST(OrderSheet, growsWithTheNumberOfItsThumbnails) {
+    const struct {
+        int upTo; // one more takes the next size
+        PictureSize edited, plain;
+    } steps[] = {{10, {450, 580}, {500, 480}},    {50, {450, 880}, {500, 880}},    {70, {660, 880}, {660, 880}},
+                 {100, {750, 1000}, {750, 1000}}, {200, {900, 1000}, {900, 1000}}, {999, {1100, 1300}, {1100, 1300}}};
+    int from = 0;
+    for (const auto& step : steps) {
+        for (const int count : {from, step.upTo}) {
+            EXPECT_EQ(orderSheetSize(SheetKind::Edited, count), step.edited) << count;
+            EXPECT_EQ(orderSheetSize(SheetKind::Plain, count), step.plain) << count;
+        }
+        from = step.upTo + 1;
+    }
 }
 
 TEST_F(ContactSheet, endsWithItsLastCellAndWhereItIsToldTo) {

@@ -29,8 +29,6 @@ protected:
         state.DiskRoot = machine.drives.programRoot();
         state.Optint = OrderKind::Print;
         state.shemot.TotalPics = 0;
-        state.profile.JppBase = 30;
-        state.profile.JppChunks = 56;
         state.transfer.SugMishloah = Sending::Resend;
         registerBare({PageId::hatchala, PageId::FtpFrm});
         registerPage<Form2>(PageId::Form2);

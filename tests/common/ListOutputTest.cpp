@@ -24,9 +24,11 @@ TEST(ListOutput, WritesTextsNumbersAndDatesInTheirForms) {
     output.pair(u"Shemot.maat"_s, u"מט"_s);
     output.text(QString()).number(-12).text(u"a \"b\", c"_s).endLine();
     output.date(moment).date(QDateTime(QDate(2026, 1, 2), QTime(0, 0))).date(std::nullopt).endLine();
+    output.date(QDateTime(QDate(2026, 1, 3), QTime(0, 5, 9))).endLine();
     EXPECT_EQ(output.bytes(), QByteArray("\"Shemot.maat\",\"\xee\xe8\"\r\n"
                                          "\"\",-12,\"a \"b\", c\"\r\n"
-                                         "#2026-11-21 14:05:09#,#2026-01-02#,#1899-12-30#\r\n"));
+                                         "#2026-11-21 14:05:09#,#2026-01-02#,#1899-12-30#\r\n"
+                                         "#2026-01-03 00:05:09#\r\n"));
 }
 
 TEST(ReadListOutput, TakesAValueBackWhateverItHolds) {

@@ -99,6 +99,21 @@ TEST_F(Mod4splitTest, AStopLeavesWholePiecesAndNoJoinedFile) {
     EXPECT_EQ(machine.files.collect(u"C:\\order"_path, Files::Depth::WithSubfolders).size(), 11);
 }
 
+TEST_F(Mod4splitTest, ASourceThatShrinksMeanwhileIsAFaultAndGivesNoShortPiece) {
+    const QByteArray bytes = bytesOf(100);
+    write(source(), bytes);
+    const Mod4split shrinking(machine.files, [&](int made, int) {
+        if (made == 2)
+            std::filesystem::resize_file(host(source()), 25);
+        return true;
+    });
+    const Cut made = shrinking.SplitFile(source(), u"10"_s, Mod4split::Target::Meforakim, u"jpp"_s);
+    ASSERT_TRUE(made.failure);
+    EXPECT_EQ(made.failure->kind, Failure::Kind::Damaged);
+    EXPECT_EQ(cutNames().size(), 2);
+    EXPECT_EQ(read(piece("001_011")) + read(piece("002_011")), bytes.left(20));
+}
+
 TEST_F(Mod4splitTest, WhatCanNotBeCutIsRefusedAndNothingIsTouched) {
     const QByteArray bytes = bytesOf(1998);
     write(source(), bytes);

@@ -296,7 +296,7 @@ TEST_F(FinishedOrders, ShowTheirFirstFileAndMoveItFourPixelsAStep) {
     EXPECT_EQ(page().controls().VScroll1.max + page().controls().VScroll1.value, 0);
 }
 
-TEST_F(FinishedOrders, WalkOutAsPackagesOfMoreThanTwoMinutesByTheClocksCount) {
+TEST_F(FinishedOrders, EachPackageStaysUntilTheClockHasCountedThreeMinutes) {
     MoogMeret& page = startWith(whole);
     machine.clock.time = at("10:00:59");
     page.Command2_Click();

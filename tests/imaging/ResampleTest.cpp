@@ -51,7 +51,7 @@ TEST(ResampleTest, staysWithinTheRoundingOfTheExactCurve) {
     }
 }
 
-TEST(ResampleTest, everyKindOfProcessorGivesTheSameBytes) {
+TEST(ResampleTest, everyVectorKernelOfThisMachineGivesTheBytesOfThePlainOne) {
     const QTemporaryDir folder;
     const std::filesystem::path path = std::filesystem::path(folder.path().toStdString()) / "a.jpg";
     const auto kernels = allKernels();

@@ -69,7 +69,7 @@ public:
                 return no(u"553 Could not create file."_s);
             m_lab.folders[m_here][remoteName] = content->left(fault.cutAfter);
             m_cut = true;
-            return cut();
+            return Failure{fault.kind, remoteName};
         }
         const std::optional<QByteArray> stored =
             m_lab.stores ? m_lab.stores(remoteName, *content) : std::optional<QByteArray>(*content);

@@ -42,6 +42,7 @@ public:
         int times = 1;
         // -1: refused, nothing stored. Otherwise the line is cut once so many bytes are stored.
         int cutAfter = -1;
+        Failure::Kind kind = Failure::Kind::Disconnected; // of a cut
     };
     std::vector<PutFault> putFaults;
 

@@ -85,6 +85,16 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         QString status;
     } cases[] = {
         {SendingPhase::Success, [](Line&) {}, u"הקבצים הועלו בהצלחה"_s},
+        {SendingPhase::Stopped,
+         [](Line& line) {
+             for (const QString& name : FtpFrmRig::names())
+                 line.remote()[name] = "there";
+             line.rig.test.pump.onPump = [&] {
+                 if (line.rig.page().phase() == SendingPhase::Checking)
+                     line.rig.page().Command15_Click();
+             };
+         },
+         u"5 קבצים שהועלו בהצלחה "_s},
         {SendingPhase::NotAll, [](Line& line) { line.lab.refusesFolders = true; }, u"לא כל הקבצים הועלו"_s},
         {SendingPhase::AllThere, [](Line& line) { line.remote()[u"stranger.jpp"_s] = "x"; },
          u"6 קבצים שהועלו בהצלחה "_s},
@@ -146,7 +156,7 @@ TEST_F(FtpFrmTest, SendsAfterTheFifteenthSecondAndOnlyOnce) {
 }
 
 // The window's own close knows nothing of the pass that runs below it.
-TEST(FtpFrm, EndsAtOnceWhenProgramOrPageGoInTheMiddle) {
+TEST(FtpFrm, EndsAtOnceWhenTheProgramOrThePageGoesInTheMiddle) {
     const std::function<void(FtpFrmRig&)> ways[] = {[](FtpFrmRig& order) { order.page().Command16_Click(); },
                                                     [](FtpFrmRig& order) { order.chain.endProgram(); },
                                                     [](FtpFrmRig& order) { order.chain.unload(PageId::FtpFrm); }};
@@ -250,7 +260,7 @@ TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {
     EXPECT_TRUE(lab.urls.at(1).endsWith(u"padd.asp"_s));
 }
 
-TEST_F(FtpFrmTest, ShowsWhatTheOrderAndTheLabCallFor) {
+TEST_F(FtpFrmTest, ShowsTheLabAreaAndTheDeliveryNoteWhereTheyAreWanted) {
     FtpFrmRig home(lab);
     home.state.KodMishloach = u"HOM"_s;
     home.state.shemot.n3 = u"Herzl 1"_s;

@@ -37,7 +37,7 @@ struct Guarded : FtpFrmLine {
 
 } // namespace
 
-TEST(FtpGuards, AnOrderWithoutPicturesDoesNotLeave) {
+TEST(FtpGuards, CarefullyAnOrderThatLacksPicturesLeavesOnlyAtTheCustomersWord) {
     struct Case {
         const char* what;
         std::function<void(Guarded&)> arrange;
@@ -129,7 +129,7 @@ TEST(FtpGuards, ALimitOfSilenceCountsFilesAndBytes) {
     EXPECT_FALSE(limit.over());
 }
 
-TEST(FtpGuards, AServerThatFallsSilentEndsTheSending) {
+TEST(FtpGuards, CarefullyAServerThatFallsSilentEndsTheSending) {
     // Nobody answers any more after the put of this name; empty: from the first connect on.
     const auto dead = [](const QString& after) {
         return [=](Guarded& order) {
@@ -234,7 +234,7 @@ TEST(FtpGuards, AnOrderThatArrivedBeforeIsOnlyReported) {
 }
 
 // The folder on the server bears the order's name: whose is it?
-TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
+TEST(FtpGuards, CarefullyNothingIsPutIntoTheFolderOfAnotherOrder) {
     using Phase = OrderState::Phase;
     const QByteArray otherLog = "\"00\",\"00\"\r\n\"Shemot.n1\",\"Someone else\"\r\n";
     const auto askFor = [](Guarded& order) { EXPECT_TRUE(order.journal().folderIsAsked(Sender::Ftp)); };
@@ -336,7 +336,7 @@ TEST(FtpGuards, NothingIsPutIntoTheFolderOfAnotherOrder) {
 }
 
 // Each put is answered well; what the server has stored is another matter.
-TEST(FtpGuards, AnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
+TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
     using Phase = OrderState::Phase;
     using Content = std::optional<QByteArray>;
     struct Case {

@@ -24,13 +24,20 @@ struct Line {
         transfer.OrderFolder = folder;
         transfer.ShemTikiya = u"order^1"_s;
         (void)test.files.makeFolder(folder);
-        for (const QString& name : names())
-            EXPECT_TRUE(test.files.writeWhole(path(name), name.toLatin1().repeated(50)));
+        for (const auto& [name, content] : whole())
+            EXPECT_TRUE(test.files.writeWhole(path(name), content));
         order(names());
         sender.session.takeSettings();
     }
 
     static QStringList names() { return {u"log.txt"_s, u"01a.jpp"_s, u"02b.jpp"_s}; }
+    // The files of the order by name.
+    static FakeLab::Folder whole() {
+        FakeLab::Folder files;
+        for (const QString& name : names())
+            files[name] = name.toLatin1().repeated(50);
+        return files;
+    }
     static DrivePath path(const QString& name) { return folder / name; }
     void order(const QStringList& leaves) {
         sender.clearLists();
@@ -151,7 +158,7 @@ TEST_F(FtpSenderTest, NotesAFailedPutWithHourAndMinuteAsTheyAre) {
 }
 
 // The faults that a relay can make on a real line stand with the real server; here those of a server's own doing.
-TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
+TEST(FtpSender, EachFaultEndsInItsPhase) {
     using enum SendingPhase;
     const auto puts = [](const FakeLab::PutFault& fault, bool refusesDelete = false) {
         return [=](Line& line) {
@@ -177,6 +184,7 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
         // The 60 tries end within the third attempt.
         {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},
+        {"timed out in the middle", puts({u"01a.jpp"_s, 1, 20, Failure::Kind::TimedOut}), Success, 2, 4},
         {"cut, and the remains can't be deleted", puts({u"01a.jpp"_s, 1, 20}, true), Success, 2, 4},
         {"cut in each attempt, remains stay", puts({u"02b.jpp"_s, FakeLab::always, 20}, true), NotAll, 4, 6},
         {"the folder of a local file itself", order({u"01a.jpp"_s, QString()}), NotAll, 4, 1},
@@ -193,7 +201,7 @@ TEST(FtpSender, ComesToTheEndThatTheServerDeserves) {
             EXPECT_EQ(line.sender.RunAttempts(), each.end);
             EXPECT_EQ(line.told.number(AttemptBegins), each.attempts);
             EXPECT_EQ(line.lab.puts.size(), kept ? each.putsOfKept : each.puts);
-            EXPECT_TRUE(each.end != Success || line.remote().size() == 3u);
+            EXPECT_TRUE(each.end != Success || line.remote() == Line::whole());
         }
     }
 }
@@ -204,14 +212,17 @@ TEST(FtpSender, AKeptSessionServesAPassUntilAFaultBeginsAnother) {
     const auto sessions = [&](const std::function<void(Line&)>& arrange) {
         Line line;
         line.transfer.keptFtpSession = true;
-        for (const QString& name : names)
-            EXPECT_TRUE(line.test.files.writeWhole(Line::path(name), QByteArray(350, 'x')));
+        FakeLab::Folder all;
+        for (const QString& name : names) {
+            all[name] = name.toLatin1().repeated(350);
+            EXPECT_TRUE(line.test.files.writeWhole(Line::path(name), all[name]));
+        }
         line.order(names);
         int ofPass = 0;
         line.lab.onConnect = [&](int) { ofPass += line.told.count(CheckBegins) == 0; };
         arrange(line);
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
-        EXPECT_EQ(line.remote().size(), std::size_t(names.size()));
+        EXPECT_EQ(line.remote(), all);
         return std::pair(ofPass, line.told.number(AttemptBegins));
     };
     EXPECT_EQ(sessions([](Line&) {}), std::pair(1, 1));
@@ -253,7 +264,7 @@ TEST_F(FtpSenderTest, DeletesTheRemainsOnlyInTheOrdersFolder) {
     };
     EXPECT_EQ(sender.RunAttempts(), SendingPhase::Success);
     EXPECT_EQ(lab.folders[base][u"01a.jpp"_s], QByteArray("another's file"));
-    EXPECT_EQ(remote()[u"01a.jpp"_s].size(), 350);
+    EXPECT_EQ(remote(), whole());
 }
 
 TEST_F(FtpSenderTest, AStopCutsTheFileInHandWhichCountsAsBrokenAndIsSentAgain) {
@@ -268,12 +279,12 @@ TEST_F(FtpSenderTest, AStopCutsTheFileInHandWhichCountsAsBrokenAndIsSentAgain) {
         EXPECT_EQ(line.told.troubles.size(), 0u) << "what a stop has cut is no trouble";
         EXPECT_EQ(line.lab.puts.size(), names().indexOf(stopAt) + 1);
         EXPECT_EQ(line.sender.lists.List4Broken.items(), QStringList(path(stopAt).text()));
-        EXPECT_LT(line.remote()[stopAt].size(), stopAt.size() * 50);
+        EXPECT_NE(line.remote(), whole());
         line.lab.onPut = {};
         line.sender.refill();
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
         EXPECT_EQ(line.lab.puts.size(), names().size() + 1);
-        EXPECT_EQ(line.remote()[stopAt].size(), stopAt.size() * 50);
+        EXPECT_EQ(line.remote(), whole());
     }
 }
 
@@ -292,6 +303,16 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
         EXPECT_EQ(line.lab.connects, stoppedAt);
     }
+}
+
+TEST_F(FtpSenderTest, AStopBeforeTheCheckHasReadTheFolderLeavesOpenWhatArrived) {
+    remote() = whole();
+    test.pump.onPump = [&] {
+        if (told.count(CheckBegins) > 0)
+            sender.stopNow();
+    };
+    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Stopped);
+    EXPECT_EQ(told.number(Counted), 3);
 }
 
 TEST_F(FtpSenderTest, ARecheckThatDoesNotReachTheFolderSaysSo) {

@@ -47,7 +47,7 @@ constexpr Press listing[] = {&FtpFrm::Command13_Click, &FtpFrm::Command1_Click, 
 
 // What each of the four buttons makes of each phase in which a sending can rest: the phase after it, how many files
 // List3 holds then, the puts and the boxes.
-TEST(LabArea, EachButtonIsSafeInEachPhase) {
+TEST(LabArea, TheFourListButtonsAreSafeInEachPhase) {
     using enum SendingPhase;
     struct After {
         SendingPhase phase;
