@@ -91,6 +91,8 @@ class Walk:
                     order.basket, order.previews, order.whole = {}, {}, False
                 if line['front'] in ('Form2', 'B3') and line['before'] == 'kyoskNew':
                     promise = copy.deepcopy(order.__dict__) | {'leftOut': ''}
+                if line['before'] in ('Form2', 'B3') and line['front'] == 'kyoskNew':  # back to the pictures: the order is taken apart
+                    promise = None
                 here = self.record / str(line['n']) / 'orders'
                 kept = here if here.is_dir() else kept
                 folder = None

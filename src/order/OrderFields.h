@@ -1,0 +1,28 @@
+#pragma once
+
+#include <QDateTime>
+#include <QList>
+#include <QString>
+
+#include <cstdint>
+#include <optional>
+#include <variant>
+
+namespace lumora {
+
+struct AlbumDetails;
+struct OrderDetails;
+
+// A field of an order under its key in the order log; the order's hidden state keeps it under the same key.
+struct OrderField {
+    QString key;
+    std::variant<QString*, std::int16_t*, std::optional<QDateTime>*> value;
+};
+using OrderFields = QList<OrderField>;
+
+// In the order of the log.
+OrderFields detailFields(OrderDetails& shemot);
+// The keys count the extras from 1. The last extra of each list is not in the log and not among them.
+OrderFields albumFields(AlbumDetails& album);
+
+} // namespace lumora
