@@ -1,6 +1,7 @@
 #include "order/OrderChoices.h"
 
 #include "common/FixedText.h"
+#include "order/OrderFields.h"
 #include "session/SessionState.h"
 
 #include <variant>
@@ -35,38 +36,21 @@ QList<Choice> choicesIn(SessionState& state) {
                              {u"DchisaAmoka"_s, &state.DchisaAmoka},
                              {u"SugTzad"_s, &state.SugTzad},
                              {u"BranchChoice"_s, &state.BranchChoice},
-                             {u"Shemot.n1"_s, &shemot.n1},
-                             {u"Shemot.n2"_s, &shemot.n2},
-                             {u"Shemot.n3"_s, &shemot.n3},
-                             {u"Shemot.n4"_s, &shemot.n4},
-                             {u"Shemot.Mail"_s, &shemot.Mail},
-                             {u"Shemot.FillFit"_s, &shemot.FillFit},
-                             {u"Shemot.Hearot"_s, &shemot.Hearot},
-                             {u"Shemot.Bord"_s, &shemot.Bord},
-                             {u"Shemot.ppr"_s, &shemot.ppr},
-                             {u"Shemot.maat"_s, &shemot.maat},
-                             {u"Shemot.ser"_s, &shemot.ser},
-                             {u"Shemot.TotalPics"_s, &shemot.TotalPics},
                              {u"Shemot.Soog1"_s, &shemot.Soog1},
                              {u"Shemot.Soog2"_s, &shemot.Soog2},
                              {u"Shemot.CustomCode"_s, &shemot.CustomCode},
-                             {u"Shemot.TimeOfJob"_s, &shemot.TimeOfJob},
                              {u"Shemot.Girsa"_s, &shemot.Girsa},
-                             {u"ShemZalam"_s, &album.ShemZalam},
-                             {u"ShemErooa"_s, &album.ShemErooa},
                              {u"TelZalam"_s, &album.TelZalam},
-                             {u"MailZalam"_s, &album.MailZalam},
-                             {u"SoogLBM"_s, &album.SoogLBM},
-                             {u"SoogKricha"_s, &album.SoogKricha},
-                             {u"SoogNiar"_s, &album.SoogNiar},
-                             {u"GodelLBM"_s, &album.GodelLBM},
-                             {u"HearotLBM"_s, &album.HearotLBM},
                              {u"KamutHorim"_s, &album.KamutHorim},
-                             {u"SoogHorim"_s, &album.SoogHorim}};
-    for (std::size_t i = 0; i < album.Tosafot1.size(); ++i)
-        choices += {u"Tosafot1_%1"_s.arg(i + 1), &album.Tosafot1[i]};
-    for (std::size_t i = 0; i < album.Tosafot2.size(); ++i)
-        choices += {u"Tosafot2_%1"_s.arg(i + 1), &album.Tosafot2[i]};
+                             {u"SoogHorim"_s, &album.SoogHorim},
+                             {u"Tosafot1_5"_s, &album.Tosafot1.back()},
+                             {u"Tosafot2_9"_s, &album.Tosafot2.back()}};
+    for (const OrderField& field : detailFields(shemot) + albumFields(album)) {
+        if (auto* const* text = std::get_if<QString*>(&field.value))
+            choices += {field.key, *text};
+        else if (auto* const* number = std::get_if<std::int16_t*>(&field.value))
+            choices += {field.key, *number};
+    }
     return choices;
 }
 

@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "common/ListOutput.h"
+#include "order/OrderFields.h"
 #include "order/OrderFolder.h"
 #include "order/OrderNames.h"
 #include "platform/files/Files.h"
@@ -53,29 +54,16 @@ Lines nameLines(OrderLog& log, const QString& prefix) {
     return {{prefix + u"Girsa"_s, &log.shemot.Girsa}, {u"Time"_s, &log.Time}, {u"Hazmana"_s, &log.Hazmana}};
 }
 
-Lines detailLines(OrderDetails& shemot) {
-    return {{u"Shemot.ser"_s, &shemot.ser},       {u"Shemot.n1"_s, &shemot.n1},
-            {u"Shemot.n2"_s, &shemot.n2},         {u"Shemot.n3"_s, &shemot.n3},
-            {u"Shemot.n4"_s, &shemot.n4},         {u"Shemot.TotalPics"_s, &shemot.TotalPics},
-            {u"Shemot.Mail"_s, &shemot.Mail},     {u"Shemot.TimeOfJob"_s, &shemot.TimeOfJob},
-            {u"Shemot.Hearot"_s, &shemot.Hearot}, {u"Shemot.ppr"_s, &shemot.ppr},
-            {u"Shemot.T1"_s, &shemot.T1},         {u"Shemot.Bord"_s, &shemot.Bord},
-            {u"Shemot.maat"_s, &shemot.maat},     {u"Shemot.FillFit"_s, &shemot.FillFit}};
+Lines linesOf(const OrderFields& fields) {
+    Lines lines;
+    for (const OrderField& field : fields)
+        lines += std::visit([&](auto* value) { return Line{field.key, value}; }, field.value);
+    return lines;
 }
 
-// The keys count the extras from 1, the session's lists from 0; the last item of each list is not written.
 Lines albumLines(OrderLog& log) {
-    AlbumDetails& album = log.album;
-    Lines lines = {{u"ser"_s, &log.shemot.ser},        {u"TotalPics"_s, &log.shemot.TotalPics},
-                   {u"GodelLBM"_s, &album.GodelLBM},   {u"Hearot"_s, &album.HearotLBM},
-                   {u"MailZalam"_s, &album.MailZalam}, {u"ShemErooa"_s, &album.ShemErooa},
-                   {u"ShemZalam"_s, &album.ShemZalam}, {u"SoogKricha"_s, &album.SoogKricha},
-                   {u"SoogLBM"_s, &album.SoogLBM},     {u"SoogNiar"_s, &album.SoogNiar}};
-    for (std::size_t i = 1; i < album.Tosafot1.size(); ++i)
-        lines += {u"Tosafot1_%1"_s.arg(i), &album.Tosafot1[i - 1]};
-    for (std::size_t i = 1; i < album.Tosafot2.size(); ++i)
-        lines += {u"Tosafot2_%1"_s.arg(i), &album.Tosafot2[i - 1]};
-    return lines;
+    return Lines{{u"ser"_s, &log.shemot.ser}, {u"TotalPics"_s, &log.shemot.TotalPics}} +
+           linesOf(albumFields(log.album));
 }
 
 // The lines above the failed pictures, in the order of the log.
@@ -83,11 +71,11 @@ Lines headLines(OrderLog& log, Layout layout) {
     // The lab's reader of an edited order accepts only the kind 5.
     if (layout == Layout::Edited)
         return serverLines(log, u" = "_s) + Lines{zeros} + nameLines(log, u"Shemot."_s) +
-               Lines{{u"Option"_s, Fixed{u"5"_s}}} + detailLines(log.shemot) + Lines{stars};
+               Lines{{u"Option"_s, Fixed{u"5"_s}}} + linesOf(detailFields(log.shemot)) + Lines{stars};
     const bool album = layout == Layout::Album;
     return (album ? Lines{zeros, zeros} : Lines{zeros}) + serverLines(log, {}) +
            Lines{{QString(12, u'-'), Fixed{QString(9, u'-')}}} + nameLines(log, album ? QString() : u"Shemot."_s) +
-           Lines{{u"Optint"_s, &log.Optint}} + (album ? albumLines(log) : detailLines(log.shemot)) +
+           Lines{{u"Optint"_s, &log.Optint}} + (album ? albumLines(log) : linesOf(detailFields(log.shemot))) +
            Lines{{u"More Comp = "_s, &log.DchisaAmoka}, stars};
 }
 
