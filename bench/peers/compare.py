@@ -12,8 +12,6 @@ import argparse, os, shutil, subprocess, sys, tempfile
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), ".."))
 from pairs import HEADING, compare, run
 
-PACKAGES = ["libvips-tools", "imagemagick", "libopencv-imgproc-dev", "libopencv-imgcodecs-dev", "libzimg-dev"]
-
 
 def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
@@ -23,7 +21,7 @@ def main():
     parser.add_argument("--install", action="store_true")
     options = parser.parse_args()
     if options.install:
-        subprocess.run(([] if os.geteuid() == 0 else ["sudo"]) + ["apt-get", "install", "-y", "-q"] + PACKAGES, check=True)
+        subprocess.run([os.path.join(sys.path[0], "../packaging/install-packages"), "peers"], check=True)
         sys.exit("installed; build the preset bench again, then run without --install")
 
     programs = os.path.join(options.build, "bench", "peers")
