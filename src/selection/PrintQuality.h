@@ -17,7 +17,7 @@ enum class PrintGrade {
 
 PrintGrade printGrade(PictureSize size);
 
-// The grade in words, height before width. Empty for Unmarked.
+// The grade in words (PrintQualityTexts.cpp), height before width. Empty for Unmarked.
 QString printGradeText(PrintGrade grade, PictureSize size, bool english);
 
 // The large view in logical units: 300 wide for an upright or square picture, else 400; the height follows.
