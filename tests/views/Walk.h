@@ -68,8 +68,7 @@ public:
 
     // Goes a route of steps with a blank between them: "Command3" is pressed on the page in front, "Command3>kyoskNew"
     // and that page waited for, "Text2=Dana_Levi" typed with a blank for the _, "Combo1~30/60" chosen, "Check4+"
-    // ticked,
-    // "!" closes the boxes, ":menu" looks.
+    // ticked, "!" closes the boxes, ":menu" looks.
     void go(const QString& route, const std::function<void(const QString& name)>& look = {});
     // A quick order with the first picture open in the editor. The lab has frames in two categories.
     void toEditor();

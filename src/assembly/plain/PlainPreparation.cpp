@@ -129,7 +129,7 @@ bool PlainPreparation::prepare(const QStringList& lines) {
     return writeLog(isAlbum() ? OrderLog::Layout::Album : OrderLog::Layout::Plain);
 }
 
-// The sheet of an order that goes on shows pictures that may be gone by now: one that is there stays.
+// A sheet that was drawn before stays: the pictures of an order that goes on may be gone by now.
 bool PlainPreparation::makeSheet() {
     const DrivePath path = m_folder->filePath(SheetName(m_state.MisparHazmana, m_state.shemot.ser, u".jpp"_s));
     if (!m_there.isEmpty() && m_platform.files.fileExists(path))

@@ -14,7 +14,8 @@ bool carried(QPointF place) {
     return within(place.x()) && within(place.y());
 }
 
-// The last place between the two that may be; the first one where from itself may not. The allowed places are convex.
+// The last allowed place on the straight way between the two, or `from` where that is not allowed itself. The allowed
+// places are convex.
 template <class MayBe>
 QPointF lastOnTheWay(QPointF from, QPointF to, const MayBe& mayBe) {
     if (mayBe(to))

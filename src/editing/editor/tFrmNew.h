@@ -161,7 +161,7 @@ public:
     int frameOnPicture() const; // its row in Combo2List, -1 for none of them
     // A small picture of a frame of Combo2List, its longer side 160 pixels; null when there is none.
     Bitmap framePicture(int index) const;
-    // What a button does in one line, for who can't hover.
+    // What a button does in one line, for customers who can't hover.
     static QString hintLine(const Caption& button);
 
 Q_SIGNALS:

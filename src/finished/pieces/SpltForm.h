@@ -52,7 +52,7 @@ struct SpltFormControls : Controls {
     Caption Image3{*this, u"Image3"};           // back
 };
 
-// The page of pieces (SpltForm, Mod4split): the lab's operator cuts the files of a folder into pieces for a slow
+// The page of pieces ("SpltForm" in the glossary): the lab's operator cuts the files of a folder into pieces for a slow
 // connection, and joins families of pieces into files again. It works on any folder and writes beside the sources. Long
 // work pumps events after each piece and can be stopped there.
 class SpltForm : public Page, private SpltFormControls {

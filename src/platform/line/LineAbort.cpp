@@ -13,7 +13,7 @@ void LineAbort::abort() {
     ++m_count;
     for (const int descriptor : m_descriptors) {
         // Linux resets a connection that is given no peer; a shutdown alone would end the data in good order. The
-        // shutdown wakes who waits where nothing is connected yet.
+        // shutdown wakes a thread that waits for a socket without a connection.
         const sockaddr nobody{AF_UNSPEC, {}};
         static_cast<void>(::connect(descriptor, &nobody, sizeof(nobody)));
         ::shutdown(descriptor, SHUT_RDWR);

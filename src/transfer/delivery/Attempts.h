@@ -33,7 +33,7 @@ protected:
         , m_stop(stop) {}
     ~Attempts() = default;
 
-    // A value ends the sending without a check: Stopped by the customer, or an end that another attempt would not mend.
+    // A value ends the sending without a check: the customer stopped it, or another attempt would end the same.
     virtual std::optional<SendingPhase> sendMissing(int attempt) = 0;
     // The end of the sending, or no value when another attempt is needed.
     virtual std::optional<SendingPhase> checkArrival(int attempt) = 0;

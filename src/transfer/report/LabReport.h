@@ -27,7 +27,7 @@ enum class Arrival {
 // ends at the latest after two minutes, and within a second where it is stopped; it then counts as begun.
 class LabReport {
 public:
-    // keep: takes each step's write.
+    // keep: is given the result of writing each step to the order's state.
     using Keep = std::function<void(const Result<void>&)>;
     LabReport(const SessionState& state, const Platform& platform, SendingStop& stop, Sender by, Keep keep);
 

@@ -24,7 +24,7 @@ namespace {
 // Four in a row, so that the large picture stands beside them.
 constexpr int columns = 4;
 
-// The two sides of a picture stay in one line.
+// Width and height of a picture stay in one line of text.
 QString unbrokenSize(const QString& text) {
     return isolated(text).replace(u" / "_s, u"\u00A0/\u00A0"_s);
 }

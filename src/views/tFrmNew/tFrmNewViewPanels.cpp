@@ -169,7 +169,7 @@ void tFrmNewView::makeOperatorPanel() {
          bar, record});
 }
 
-// --- the hints in words, for who can't hover ---
+// --- the hints in words, for customers who can't hover ---
 
 void tFrmNewView::makeHints() {
     m_hints = new Overlay(theme(), this);
