@@ -4,8 +4,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 constexpr double centimetresPerInch = 2.54;
@@ -35,22 +33,6 @@ PrintResolution PrintResolution::ofEdited(PictureSize picture, PaperSize paper, 
 
 PrintResolution::Grade PrintResolution::grade() const {
     return m_dots >= leastSharp ? Grade::Sharp : m_dots >= leastFair ? Grade::Fair : Grade::Coarse;
-}
-
-QString PrintResolution::text() const {
-    return u"%1 dpi"_s.arg(m_dots);
-}
-
-QString PrintResolution::word(bool english) const {
-    switch (grade()) {
-    case Grade::Sharp:
-        return english ? u"sharp"_s : u"חדה"_s;
-    case Grade::Fair:
-        return english ? u"fair"_s : u"סבירה"_s;
-    case Grade::Coarse:
-        break;
-    }
-    return english ? u"coarse"_s : u"מפוקסלת"_s;
 }
 
 } // namespace lumora

@@ -2,8 +2,6 @@
 
 #include "editing/render/PlainPrint.h"
 
-#include <QString>
-
 namespace lumora {
 
 struct EditFields;
@@ -24,9 +22,6 @@ public:
     // The whole dots; a part of one does not count.
     int dotsPerInch() const { return m_dots; }
     Grade grade() const;
-
-    QString text() const;             // "304 dpi"
-    QString word(bool english) const; // "sharp"
 
 private:
     explicit PrintResolution(double pixelsOnCentimetre);

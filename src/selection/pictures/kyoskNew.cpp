@@ -2,6 +2,7 @@
 
 #include "common/DrivePath.h"
 #include "common/FixedText.h"
+#include "editing/ResolutionWords.h"
 #include "editing/editor/tFrmNew.h"
 #include "order/CouponLimit.h"
 #include "order/EditRecord.h"
@@ -131,7 +132,8 @@ void kyoskNew::showCell(int cell) {
                           : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
                                     : words(u"%1, לחץ לעריכה", u"%1, press to edit");
     if (prints)
-        Picture1[at].spoken += u", "_s + prints->text() + u": "_s + prints->word(m_state.english());
+        Picture1[at].spoken +=
+            u", "_s + ResolutionDots(*prints) + u": "_s + ResolutionWord(prints->grade(), m_state.english());
     Command12[at].spoken = words(u"עותק נוסף של %1", u"One more copy of %1");
     Command13[at].spoken = words(u"עותק אחד פחות של %1", u"One copy less of %1");
 }
