@@ -29,7 +29,7 @@ void Preparation::begin(const QStringList& lines) {
     m_prints = 0;
     m_withoutPrints = false;
     m_writeFailures = 0;
-    m_state.transfer.leftOut.clear();
+    m_state.transfer.leftOut = m_noJpeg;
     m_state.transfer.leftOutAsked = false;
     m_state.transfer.MailFlag = 0;
     count(m_lines);
@@ -41,6 +41,8 @@ void Preparation::takeHandOver() {
     const DrivePath& before = goesOn.isEmpty() ? m_replaced : goesOn;
     if (before.isEmpty())
         return;
+    m_noJpeg = m_state.transfer.leftOut;
+    m_noJpeg.removeIf([](const LeftOut& picture) { return picture.why != LeftOut::Why::NoJpeg; });
     const Workspace workspace(m_state, m_platform.files);
     QString number = m_state.MisparHazmana; // the order has its own
     if (workspace.MakeWorkspace())

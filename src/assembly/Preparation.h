@@ -95,6 +95,7 @@ protected:
     const Platform& m_platform;
     PreparationEvents& m_events;
     QStringList m_lines;
+    QList<LeftOut> m_noJpeg;             // what was left out for its ending, also before the order went on
     std::optional<OrderFolder> m_folder; // set by claimFolder()
     QSet<int> m_there;                   // indices of the lines whose print is there
     bool m_sheetSaved = true;            // or the page does not save it

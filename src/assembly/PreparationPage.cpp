@@ -1,5 +1,6 @@
 #include "assembly/PreparationPage.h"
 
+#include "order/LeftOutPictures.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -18,7 +19,7 @@ PreparationPage::PreparationPage(PageId id, SessionState& state, const Platform&
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
-    , m_leftOut(id, state, platform, chain, shown) {}
+    , m_leftOut(id, state, chain, shown) {}
 
 bool PreparationPage::takeLines() {
     shared().List1.append(std::exchange(m_state.handOver.lines, {}));
@@ -104,6 +105,10 @@ void PreparationPage::handOver(Outcome toSender) {
         m_chain.unload(id());
 }
 
+Bitmap PreparationPage::smallLeftOut(int index, int cell) const {
+    return SmallLeftOut(m_state, m_platform.files, index, cell);
+}
+
 void PreparationPage::askWithoutPrints() {
     m_leftOut.open(LeftOutBox::Order::WithoutPrints);
     Q_EMIT changed();
@@ -117,7 +122,8 @@ void PreparationPage::goOnWithout() {
 }
 
 void PreparationPage::goBack() {
-    m_leftOut.goBack();
+    if (m_leftOut.goBack())
+        RemoveOrderGoneBackFrom(m_state, m_platform);
 }
 
 void PreparationPage::leaveProgram() {

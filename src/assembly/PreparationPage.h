@@ -2,8 +2,8 @@
 
 #include "assembly/Preparation.h"
 #include "imaging/Bitmap.h"
-#include "order/LeftOutBox.h"
 #include "session/Caption.h"
+#include "session/LeftOutBox.h"
 #include "session/Page.h"
 #include "session/PageFlow.h"
 #include "session/TextList.h"
@@ -48,6 +48,8 @@ public:
     QString totalText() const;
     // What List1 is called where it is not seen.
     QString listText() const;
+    // As SmallLeftOut().
+    Bitmap smallLeftOut(int index, int cell) const;
     bool isSheetShown() const { return controls().Picture5.visible && !controls().Picture5Image.isNull(); }
 
 protected:

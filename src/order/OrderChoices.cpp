@@ -54,6 +54,9 @@ QList<Choice> choicesIn(SessionState& state) {
     return choices;
 }
 
+// Behind it stands a number from 1.
+constexpr QStringView noJpegKey = u"NoJpeg_";
+
 struct AsText {
     QString operator()(const QString* text) const { return *text; }
     QString operator()(const std::int16_t* number) const { return QString::number(*number); }
@@ -83,12 +86,20 @@ QList<ListOutputEntry> ChoicesOf(const SessionState& state) {
     QList<ListOutputEntry> choices;
     for (const Choice& choice : choicesIn(copy))
         choices += {choice.key, std::visit(AsText{}, choice.field)};
+    int number = 0;
+    for (const LeftOut& picture : state.transfer.leftOut) {
+        if (picture.why == LeftOut::Why::NoJpeg)
+            choices += {noJpegKey.toString() + QString::number(++number), picture.picture.text()};
+    }
     return choices;
 }
 
 void TakeChoices(const QList<ListOutputEntry>& choices, SessionState& state) {
     const QList<Choice> known = choicesIn(state);
+    state.transfer.leftOut.clear();
     for (const auto& [key, value] : choices) {
+        if (key.startsWith(noJpegKey))
+            state.transfer.leftOut += LeftOut{DrivePath(value), LeftOut::Why::NoJpeg};
         for (const Choice& choice : known) {
             if (choice.key == key)
                 std::visit(FromText{value}, choice.field);

@@ -4,7 +4,7 @@
 #include "order/BasketLine.h"
 #include "order/EditRecord.h"
 #include "order/FinishedOrder.h"
-#include "order/LeftOutBox.h"
+#include "order/LeftOutPictures.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
@@ -103,7 +103,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
     state.transfer.HazmanaP = inPieces ? 1 : 0;
     state.transfer.Mefurak = inPieces ? Travel::Pieces : Travel::Whole;
     state.transfer.SugMishloah = Sending::NewOrder;
-    state.transfer.leftOut = LeftOutOf(failedOf(files, order.folder).value_or(QStringList()));
+    state.transfer.leftOut += LeftOutOf(failedOf(files, order.folder).value_or(QStringList()));
     state.transfer.leftOutAsked = order.state.phase != Phase::Prepared;
     if (order.state.choices.isEmpty())
         ReadReportDetails(files, order.folder.logPath(), state.shemot);

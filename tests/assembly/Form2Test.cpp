@@ -184,8 +184,8 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
     const QString good = line(givePicture(u"good.jpg"_s)), bad = line(giveFile(u"bad.jpg"_s, "no picture"));
     const QStringList mixed = {good, bad, line(u"C:\\pics\\caf?.jpg"_s), line(u"C:\\pics\\gone.jpg"_s),
                                line(u"C:\\x.png"_s)};
-    const QString named = u"bad.jpg – לא ניתן לקרוא את הקובץ|caf?.jpg – בשם הקובץ יש אות שאינה נתמכת|"
-                          u"gone.jpg – הקובץ לא נמצא|x.png – סיומת הקובץ אינה jpg או JPG"_s;
+    const QString named = u"x.png: סיומת הקובץ אינה jpg או JPG|bad.jpg: לא ניתן לקרוא את הקובץ|"
+                          u"caf?.jpg: בשם הקובץ יש אות שאינה נתמכת|gone.jpg: הקובץ לא נמצא"_s;
     enum class Answer { None, GoOn, Back };
     const struct {
         bool careful, station;
@@ -201,8 +201,8 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
                  {false, true, mixed, named, Answer::GoOn, PageId::hatchala, true, 4},
                  {false, true, mixed, named, Answer::Back, PageId::kyoskNew, true, 0},
                  {false, false, {bad}, {}, Answer::None, PageId::FtpFrm, true, 1},
-                 {true, false, {bad}, named.section(u'|', 0, 0), Answer::Back, PageId::kyoskNew, false, 0},
-                 {true, false, {bad}, named.section(u'|', 0, 0), Answer::GoOn, PageId::Form2, false, 1}};
+                 {true, false, {bad}, named.section(u'|', 1, 1), Answer::Back, PageId::kyoskNew, false, 0},
+                 {true, false, {bad}, named.section(u'|', 1, 1), Answer::GoOn, PageId::Form2, false, 1}};
     for (const auto& c : cases) {
         SCOPED_TRACE(&c - cases);
         state.Careful = c.careful;
@@ -215,7 +215,10 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
         if (front() == PageId::Form2) {
             const LeftOutControls& shown = page.controls().leftOut;
             EXPECT_TRUE(shown.Pic4Hasserot.visible);
-            EXPECT_EQ(shown.List4Hasserot.items().join(u'|'), c.named);
+            QStringList told;
+            for (int i = 0; i < shown.List4Hasserot.count(); ++i)
+                told += shown.List4Hasserot.item(i) + u": "_s + shown.List4Siba.item(i);
+            EXPECT_EQ(told.join(u'|'), c.named);
             page.Command3_Click(); // nothing is prepared behind the box
             c.answer == Answer::GoOn ? page.Command4Bli_Click() : page.Command4Hazor_Click();
         }

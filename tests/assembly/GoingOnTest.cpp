@@ -89,7 +89,7 @@ TEST_F(GoingOnWithAnOrder, MakesAllPrintsAnewInAnotherShapeAndCountsAPictureThat
     QStringList paths;
     for (int i = 0; i < 4; ++i)
         paths += givePicture(u"picture%1.jpg"_s.arg(i));
-    prepareAndKill(false, {line(paths[0]), line(paths[1]), line(paths[2]), line(paths[3])});
+    prepareAndKill(false, {line(paths[0]), line(paths[1]), line(paths[2]), line(paths[3]), line(u"C:\\x.png"_s)});
     fs::remove(host(paths[3]));
     state.profile.JppChunks = 40;
     const UnfinishedOrder before = goOn();
@@ -101,6 +101,7 @@ TEST_F(GoingOnWithAnOrder, MakesAllPrintsAnewInAnotherShapeAndCountsAPictureThat
     OrderLog log;
     log.read(*machine.files.read(logPath()));
     EXPECT_EQ(log.failed, QStringList(paths[3]));
+    EXPECT_EQ(state.transfer.leftOut.value(0).picture, u"C:\\x.png"_path) << "it stands in no line and not in the log";
 }
 
 TEST_F(GoingOnWithAnOrder, TakesTheReplacedOrderAwayOnceTheNewOneIsWhole) {

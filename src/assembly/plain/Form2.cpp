@@ -60,7 +60,7 @@ void Form2::prepare() {
     List4fail.clear();
     keepOnlyJpeg();
     if (!somethingChosen()) {
-        tellRemoved();
+        m_preparation.leaveOutAll();
         if (!List4removed.isEmpty())
             askWithoutPrints();
         return;
@@ -71,7 +71,6 @@ void Form2::prepare() {
     const bool made = m_preparation.prepare(List1.items());
     if (m_chain.hasEnded())
         return;
-    tellRemoved();
     setPreparing(false);
     setStage(made ? Stage::Done : Stage::Waiting);
     if (m_preparation.endedWithoutPrints())
@@ -106,15 +105,6 @@ void Form2::keepOnlyJpeg() {
         m_preparation.keepOnlyJpeg(List1, List4removed);
     showProgress();
     Q_EMIT changed();
-}
-
-// What is no JPEG stands neither among the failed pictures nor in the log.
-void Form2::tellRemoved() {
-    QList<LeftOut>& pictures = m_state.transfer.leftOut;
-    if (List1.isEmpty())
-        pictures.clear();
-    for (const QString& path : List4removed.items())
-        pictures += LeftOut{DrivePath(path), LeftOut::Why::NoJpeg};
 }
 
 bool Form2::sheetDrawn(const Bitmap& sheet) {

@@ -67,7 +67,6 @@ private:
     void choose(int index);
 
     void keepOnlyJpeg();
-    void tellRemoved();
     void setPreparing(bool on) override;
     void showProgress() override;
     bool sheetDrawn(const Bitmap& sheet) override;

@@ -88,11 +88,13 @@ private:
     Ahead m_prints;
 };
 
-void PlainPreparation::keepOnlyJpeg(TextList& lines, TextList& removed) const {
+void PlainPreparation::keepOnlyJpeg(TextList& lines, TextList& removed) {
     for (int i = 0; i < lines.count(); ++i) {
         if (isJpegItem(lines.item(i), m_state.Careful))
             continue;
-        removed.append(split(lines.item(i)).path.text());
+        const DrivePath picture = split(lines.item(i)).path;
+        removed.append(picture.text());
+        m_noJpeg += LeftOut{picture, LeftOut::Why::NoJpeg};
         lines.removeAt(i);
     }
 }

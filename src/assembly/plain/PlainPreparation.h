@@ -13,7 +13,9 @@ public:
 
     // Moves the lines that name no JPEG file to removed. A walk passes over the line behind a removed one, which the
     // next walk reads. As built in, "Jpg" and the like are no such ending.
-    void keepOnlyJpeg(TextList& lines, TextList& removed) const;
+    void keepOnlyJpeg(TextList& lines, TextList& removed);
+    // Nothing is left to prepare: leftOut has what keepOnlyJpeg() has removed.
+    void leaveOutAll() { m_state.transfer.leftOut = m_noJpeg; }
 
     bool isAlbum() const;
     // No value when a click ended the program.

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "order/LeftOutBox.h"
 #include "session/Caption.h"
+#include "session/LeftOutBox.h"
 
 namespace lumora {
 

@@ -1,6 +1,7 @@
 #include "transfer/delivery/SendingPage.h"
 
 #include "order/CompletenessGuard.h"
+#include "order/LeftOutPictures.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
@@ -38,7 +39,7 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
     , m_chain(chain)
     , m_countdown(countdown)
     , m_shown(shown)
-    , m_leftOut(id, state, platform, chain, shown.leftOut)
+    , m_leftOut(id, state, chain, shown.leftOut)
     , Timer4Report(reportTick, [this] { watchReport(); }) {
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
         if (page == this)
@@ -122,9 +123,13 @@ void SendingPage::goOnWithout() {
     Q_EMIT changed();
 }
 
+Bitmap SendingPage::smallLeftOut(int index, int cell) const {
+    return SmallLeftOut(m_state, m_platform.files, index, cell);
+}
+
 void SendingPage::goBack() {
-    if (!isUnderWay(m_phase))
-        m_leftOut.goBack();
+    if (!isUnderWay(m_phase) && m_leftOut.goBack())
+        RemoveOrderGoneBackFrom(m_state, m_platform);
 }
 
 void SendingPage::enter(SendingPhase phase) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "imaging/Bitmap.h"
 #include "order/OrderCompleteness.h"
 #include "session/Page.h"
 #include "session/Ticker.h"
@@ -43,6 +44,9 @@ public:
     SendingGauge gauge() const;
     const Countdown& countdown() const { return m_countdown; }
     const SendingControls& sendingControls() const { return m_shown; }
+
+    // As SmallLeftOut().
+    Bitmap smallLeftOut(int index, int cell) const;
 
     // What the operator's area shows of the order. A telling that was begun may have been heard or not.
     bool reportUnknown() const;

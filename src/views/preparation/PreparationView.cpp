@@ -11,7 +11,8 @@ PreparationView::PreparationView(PreparationPage& page, const SessionState& stat
                                  const Caption& title, const Caption& warning, const Caption& warningBelow)
     : LeftOutView(
           page, state, theme, page.controls().leftOut, [&page] { page.Command4Bli_Click(); },
-          [&page] { page.Command4Hazor_Click(); })
+          [&page] { page.Command4Hazor_Click(); },
+          [&page](int index, int cell) { return page.smallLeftOut(index, cell); })
     , m_page(page)
     , m_title(title)
     , m_gauge(new Gauge(theme, this))

@@ -17,7 +17,8 @@ using namespace Qt::StringLiterals;
 SendingView::SendingView(SendingPage& page, const SessionState& state, const Theme& theme)
     : LeftOutView(
           page, state, theme, page.sendingControls().leftOut, [&page] { page.Command4Bli_Click(); },
-          [&page] { page.Command4Hazor_Click(); })
+          [&page] { page.Command4Hazor_Click(); },
+          [&page](int index, int cell) { return page.smallLeftOut(index, cell); })
     , m_page(page)
     , m_gauge(new Gauge(theme, this)) {
     frame().steps().setStep(OrderStep::Sending);

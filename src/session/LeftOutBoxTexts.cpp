@@ -1,5 +1,5 @@
 // The wording of the box of left out pictures, in both languages.
-#include "order/LeftOutBox.h"
+#include "session/LeftOutBox.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -47,9 +47,13 @@ void LeftOutBox::show() {
                                       ? m_state.wording(u"אין בהזמנה אף תמונה שניתן להדפיס, ולכן היא לא תישלח.",
                                                         u"No picture of the order can be printed, so it is not sent.")
                                       : m_shown.Label4Kartis.text;
+    m_shown.noPicture = m_state.wording(u"אין תמונה", u"No picture");
     m_shown.List4Hasserot.clear();
-    for (const LeftOut& picture : m_state.transfer.leftOut)
-        m_shown.List4Hasserot.append(picture.picture.leaf() + u" – "_s + reasonText(m_state, picture.why));
+    m_shown.List4Siba.clear();
+    for (const LeftOut& picture : m_state.transfer.leftOut) {
+        m_shown.List4Hasserot.append(picture.picture.leaf());
+        m_shown.List4Siba.append(reasonText(m_state, picture.why));
+    }
     m_shown.Command4Bli.text = one ? m_state.wording(u"להמשיך בלעדיה", u"Go on without it")
                                    : m_state.wording(u"להמשיך בלעדיהן", u"Go on without them");
     m_shown.Command4Bli.visible = !withoutPrints;

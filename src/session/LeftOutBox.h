@@ -7,8 +7,6 @@
 namespace lumora {
 
 class PageChain;
-struct LeftOut;
-struct Platform;
 struct SessionState;
 
 // The box that names the chosen pictures that are not in the order, each with the reason, and the card that repeats
@@ -18,7 +16,9 @@ struct LeftOutControls {
 
     Caption Pic4Hasserot;   // the box
     Caption Label4Hasserot; // how many there are
-    TextList List4Hasserot; // name and reason
+    TextList List4Hasserot; // their file names
+    TextList List4Siba;     // the reason of each
+    QString noPicture;      // stands for a picture that can't be shown
     Caption Command4Bli;    // goes on without them
     Caption Command4Hazor;  // back to the pictures, or to the start
     Caption Label4Kartis;   // the card
@@ -28,7 +28,7 @@ struct LeftOutControls {
 // until it is answered. As built in, the order goes on behind it.
 class LeftOutBox {
 public:
-    LeftOutBox(PageId page, SessionState& state, const Platform& platform, PageChain& chain, LeftOutControls& shown);
+    LeftOutBox(PageId page, SessionState& state, PageChain& chain, LeftOutControls& shown);
 
     // Pictures were left out, and the customer has not been asked.
     bool isDue() const;
@@ -45,27 +45,22 @@ public:
 
     // The answers close the box.
     void goOnWithout();
-    // Takes the order's folder away and gives the basket back to the page of pictures: number, small views and
-    // corrected copies stay. Without a basket, as for an order that was taken up, goes to the start page, and the
-    // folder stays.
-    void goBack();
+    // Gives the basket back to the page of pictures, and number, small views and corrected copies stay. True: that page
+    // is shown, and the order's folder is no longer needed. Without a basket, as for an order that was taken up, goes
+    // to the start page, and the folder stays.
+    bool goBack();
 
 private:
     bool leadsToPictures() const;
     void close();
-    void removeOrder();
 
     const PageId m_page;
     SessionState& m_state;
-    const Platform& m_platform;
     PageChain& m_chain;
     LeftOutControls& m_shown;
     Order m_order = Order::HasPrints;
     bool m_wayBack = true;
 };
-
-// The pictures that the log names as failed, as left out.
-QList<LeftOut> LeftOutOf(const QStringList& failed);
 
 // How many pictures are not in the order, as a sentence; empty for none.
 QString LeftOutText(const SessionState& state);
