@@ -90,7 +90,7 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     ASSERT_TRUE(pictures.controls().Frame4.visible);
     tapAndType(walk, u"Combo1"_s, u"lab.example"_s);
     EXPECT_EQ(pictures.controls().Combo1.text, u"lab.example"_s) << "in place of the prompt";
-    press(walk, u"Command7"_s);
+    walk.key(Qt::Key_Return); // goes on, as in every box that is typed in
     walk.waitFor(u"FtpFrm"_s);
     EXPECT_EQ(walk.program().state().shemot.n1, u"Dana Levi"_s);
     EXPECT_EQ(walk.program().state().shemot.Bord, u"WB"_s);
@@ -99,6 +99,7 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     walk.program().dialogs().nextAnswer = [&] { return std::optional(!(asked = true)); };
     walk.program().window().close();
     EXPECT_TRUE(asked && !walk.program().chain().hasEnded());
+    EXPECT_EQ(walk.program().dialogs().shownTexts.last(), u"לצאת מהתוכנה?"_s) << "nothing is lost";
 }
 
 TEST(Keyboard, StaysOnACardThatIsTaken) {

@@ -9,4 +9,7 @@ namespace lumora {
 // is another one or nothing there can be pressed.
 bool pressByEnter(const QKeyEvent& event, QWidget* focus);
 
+// Enter in a box that is typed in goes on, by the main button of the page or panel.
+bool endsTyping(const QKeyEvent& event, const QWidget* focus);
+
 } // namespace lumora

@@ -7,9 +7,12 @@
 #include <QFrame>
 #include <QKeyEvent>
 #include <QPainter>
+#include <QPushButton>
 #include <QVBoxLayout>
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 Overlay::Overlay(const Theme& theme, QWidget* parent, std::initializer_list<Item> items)
     : QWidget(parent)
@@ -146,8 +149,17 @@ void Overlay::keyPressEvent(QKeyEvent* event) {
         event->accept();
         return;
     }
-    pressByEnter(*event, QApplication::focusWidget());
+    QWidget* focus = QApplication::focusWidget();
+    if (!pressByEnter(*event, focus) && endsTyping(*event, focus))
+        pressMain();
     event->accept(); // nothing of the page below answers meanwhile
+}
+
+void Overlay::pressMain() {
+    for (auto* button : m_card->findChildren<QPushButton*>()) {
+        if (button->property("role") == u"main"_s && button->isVisible() && button->isEnabled())
+            return button->click();
+    }
 }
 
 void Overlay::mousePressEvent(QMouseEvent* event) {

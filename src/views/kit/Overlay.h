@@ -52,6 +52,7 @@ protected:
 private:
     void place();
     void cutCard();
+    void pressMain();
 
     const Theme& m_theme;
     QFrame* m_card;

@@ -183,7 +183,7 @@ void PageView::keyPressEvent(QKeyEvent* event) {
     QWidget* focus = QApplication::focusWidget();
     if (pressByEnter(*event, focus))
         return;
-    if ((event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && qobject_cast<QLineEdit*>(focus)) {
+    if (endsTyping(*event, focus)) {
         for (const Control& control : m_controls) {
             auto* main = qobject_cast<QPushButton*>(control.widget);
             if (main && main->property("role") == u"main"_s && main->isVisible() && main->isEnabled()) {
