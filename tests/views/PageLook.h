@@ -43,11 +43,13 @@ protected:
     void go(Walk& walk, const QString& route) {
         walk.go(route, [&](const QString& name) { look(walk, name); });
     }
-    // The picker waits in an event loop of its own below the press: it is looked at from within, and cancelled.
-    void lookAtPicker(Walk& walk, const QString& page, const QString& button, const QString& name) {
+    // The picker waits in an event loop of its own below the press, as a question does: it is looked at from within,
+    // and cancelled.
+    void lookAtPicker(Walk& walk, const QString& page, const QString& button, const QString& name,
+                      const QString& answer = u"pickerCancel"_s) {
         QTimer timer;
         QObject::connect(&timer, &QTimer::timeout, &timer, [&] {
-            auto* cancel = walk.program().window().findChild<QWidget*>(u"pickerCancel"_s);
+            auto* cancel = walk.program().window().findChild<QWidget*>(answer);
             if (!cancel || !cancel->isVisible())
                 return;
             timer.stop();

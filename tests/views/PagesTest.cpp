@@ -15,20 +15,22 @@
 namespace lumora {
 
 TEST_P(PageLook, FromTheStartToTheTerms) {
-    Walk walk(GetParam());
+    Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
-    go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! "_s + toOptions + u":07-options "_s);
+    go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! Text2=Dana Text3=+1-212-555-01234"_s);
+    lookAtPicker(walk, u"nnn"_s, u"Command12"_s, u"06-long-telephone"_s, u"messageNo"_s);
+    go(walk, toOptions + u":07-options "_s);
     go(walk, toBorder + u":08-border "_s + toTerms + u":09-terms Command3 :09-terms-not-agreed !"_s);
 }
 
 TEST_P(PageLook, FromThePicturesToTheSending) {
-    Walk walk(GetParam(), u"[Switches]\nCoupon = no\n"_s);
+    Walk walk(GetParam(), u"[Switches]\nCoupon = no\n[Guards]\nCareful = yes\n"_s);
     go(walk, toDetails + toOptions + toBorder + toTerms + toPictures + u":10-no-pictures"_s);
     lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
     go(walk, u"Picture1(0) Picture1(1) Picture1(4) Command12(1) :12-pictures Picture2>Form3 :12-upright Command1 "
              ":12-turned Command3>kyoskNew Image6 :13-help helpClose Image10 :14-leave Command4 Image7 :15-closing "
-             "Command7>FtpFrm"_s);
+             "Text1=dana Command8 :15-domain-wanted ! :15-domain Command7>FtpFrm"_s);
     walk.settle(200);
     look(walk, u"17-countdown"_s);
 }
@@ -38,15 +40,17 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
         GetParam(),
         u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
         "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
-        "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n"_s);
+        "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n[Guards]\nCareful = yes\n"_s);
+    walk.program().state().coupon.HaKoopon = 1;
     go(walk, toMenu + u"Image1(2) "_s + toOptions);
     const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;
     walk.choose(u"nnn"_s, u"Combo1"_s, sizes.item(sizes.lastIndex()));
-    go(walk, u"Option3(0) "_s + toTerms + u":23-fit Option4 "_s + toPictures);
+    go(walk, u":23-no-coupon ! Option3(0) "_s + toTerms + u":23-fit Option4 "_s + toPictures);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
     go(walk, u":23-whole-folder Command24 Picture1(2) :23-fitted"_s);
+    walk.program().state().coupon.MisparKoopon = 15;
+    go(walk, u"Image7 :24-coupon-refuses !"_s);
     walk.program().state().coupon.MisparKoopon = 14;
-    walk.program().state().coupon.HaKoopon = 1;
     go(walk, u"Image7 :24-panel-in-front Command21 :24-branches Command4Snif(10) :24-closing-coupon "
              "showCoarse :24-coarse"_s);
 }
@@ -60,7 +64,9 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     walk.program().chain().show(PageId::Form2);
     look(walk, u"25-plain-to-prepare"_s);
     const QString code = u"1 1015GNB"_s + EditRecord::newPicture() + walk.pictureFolder().text();
-    state.handOver.lines = {code + u"\\missing picture.jpg"_s};
+    for (int i = 1; i <= 9; ++i)
+        state.handOver.lines += code + u"\\missing picture%1.jpg"_s.arg(i);
+    walk.write(walk.pictureFolder() / u"missing picture2.jpg", "no picture");
     for (int i = 1; i <= 12; ++i)
         state.handOver.lines += code + u"\\IMG_00%1.jpg"_s.arg(i, 2, 10, QChar(u'0'));
     // An order whose folder can't be made waits for a second press.

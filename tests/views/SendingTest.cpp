@@ -126,11 +126,27 @@ TEST_P(SendingLook, ByFtpAtTheEndsThatAreNoFailure) {
 
     state.handOver.lines = {path};
     remote().clear();
+    auto& part = open<FtpFrm>();
+    startNow(part);
+    EXPECT_EQ(part.phase(), SendingPhase::PartThere);
+    look(walk, u"24-part-there"_s);
+
+    state.handOver.lines = {path};
+    remote().clear();
     auto& stopped = open<FtpFrm>();
     lab.onPut = [&](const QString&) { stopped.Command15_Click(); };
     startNow(stopped);
     EXPECT_EQ(stopped.phase(), SendingPhase::Stopped);
     go(walk, u"! :24-stopped"_s);
+
+    state.transfer.SugMishloah = Sending::NewOrder;
+    state.Careful = true;
+    lab.onPut = {};
+    lab.deadCalls = FakeLab::always;
+    auto& untold = open<FtpFrm>();
+    startNow(untold);
+    EXPECT_TRUE(untold.phase() == SendingPhase::Success && untold.reportUnknown());
+    look(walk, u"24-untold"_s);
 }
 
 TEST_P(SendingLook, WithoutAnOrderAndWithoutAServer) {
