@@ -6,6 +6,7 @@
 #include <QDateTime>
 #include <QString>
 
+#include <chrono>
 #include <cstdint>
 
 // Small interfaces of the machine that pages use.
@@ -15,6 +16,8 @@ class Clock {
 public:
     virtual ~Clock() = default;
     virtual QDateTime now() const = 0;
+    // Since an unknown moment. It only runs forward, whatever now() is set to, and stands while the machine sleeps.
+    virtual std::chrono::milliseconds running() const = 0;
 };
 
 // Long loops call pump(): it handles pending events and paints the page, so a click or a timer may run inside.

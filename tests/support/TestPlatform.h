@@ -45,7 +45,9 @@ public:
 class FixedClock : public Clock {
 public:
     QDateTime now() const override { return time; }
+    std::chrono::milliseconds running() const override { return ran; }
     QDateTime time = QDateTime(QDate(2026, 11, 21), QTime(14, 5, 9));
+    std::chrono::milliseconds ran{0};
 };
 
 // Counts the pumps; a test may let something happen at one, as a click that arrives meanwhile.

@@ -408,7 +408,7 @@ TEST_F(UploadFormTest, CarefullyASilentServerEndsTheSending) {
         silent.deadPosts = standsStill ? 0 : FakeLab::always;
         silent.onPost = [&](const QString&) {
             for (int i = 0; standsStill && i < 31; ++i) {
-                rigged.test.clock.time = rigged.test.clock.time.addSecs(10);
+                rigged.test.clock.ran += std::chrono::seconds(10);
                 rigged.page().Timer4Line_Tick();
             }
         };

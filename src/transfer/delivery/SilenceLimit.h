@@ -1,8 +1,10 @@
 #pragma once
 
-#include <QDateTime>
+#include <QtGlobal>
 
+#include <chrono>
 #include <deque>
+#include <optional>
 
 namespace lumora {
 
@@ -22,21 +24,24 @@ public:
     // After each file of a pass and each reconnect of a check. all: every try to connect ran into the time limit.
     void connectsTimedOut(bool all);
     // Told about once a second while the pass runs. bytes: a count that only grows, with what a skipped file has.
-    void moved(qint64 bytes, const QDateTime& now);
+    // running: of the Clock. A longer gap counts for a minute, since the program may have been held.
+    void moved(qint64 bytes, std::chrono::milliseconds running);
     bool over() const;
     // moved() with what the line has moved by now, and skipped; then over().
     bool overAfter(const Platform& platform, qint64 skipped = 0);
 
 private:
     struct Sample {
-        QDateTime time;
+        std::chrono::milliseconds at{0};
         qint64 bytes = 0;
     };
 
     const SessionState& m_state;
-    qint64 m_least = 0;           // bytes of five minutes
-    std::deque<Sample> m_samples; // of the last five minutes, and one older
-    int m_silentFiles = 0;        // in a row
+    qint64 m_least = 0;                              // bytes of five minutes
+    std::optional<std::chrono::milliseconds> m_told; // the last time that was told
+    std::chrono::milliseconds m_passed{0};           // since the begin, as far as it counts
+    std::deque<Sample> m_samples;                    // of the last five minutes, and one older
+    int m_silentFiles = 0;                           // in a row
     bool m_tooSlow = false;
 };
 
