@@ -10,10 +10,11 @@ namespace lumora {
 bool CompletenessGuard::maySend(const OrderFolder& folder, const QStringList& names) const {
     if (!m_state.Careful)
         return true;
-    const OrderCompleteness counts = OrderCompleteness::read(m_platform.files, folder, names);
+    const OrderCompleteness counts =
+        OrderCompleteness::read(m_platform.files, folder, names, DamagedPrints(m_platform.files, folder));
     switch (counts.verdict()) {
     case OrderCompleteness::Verdict::None:
-        tellNoPicture();
+        tellNoPicture(counts);
         return false;
     case OrderCompleteness::Verdict::Fewer:
         return askForFewer(counts);

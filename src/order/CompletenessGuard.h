@@ -22,7 +22,7 @@ public:
 
 private:
     // The words, in CompletenessGuardTexts.cpp.
-    void tellNoPicture() const;
+    void tellNoPicture(const OrderCompleteness& counts) const;
     bool askForFewer(const OrderCompleteness& counts) const;
 
     const SessionState& m_state;

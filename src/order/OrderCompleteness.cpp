@@ -2,6 +2,7 @@
 
 #include "order/OrderFolder.h"
 #include "order/OrderLog.h"
+#include "order/OrderState.h"
 #include "order/PieceName.h"
 #include "order/PrintFileName.h"
 #include "platform/files/Files.h"
@@ -62,19 +63,39 @@ OrderCompleteness::Verdict OrderCompleteness::verdict() const {
     return sent() < *named ? Verdict::Fewer : Verdict::Whole;
 }
 
-OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& present, const QStringList& marked) {
+OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& present, const QStringList& marked,
+                                        const QStringList& damagedNames) {
+    const auto whole = [&](QStringList names) {
+        names.removeIf([&](const QString& name) { return damagedNames.contains(name); });
+        return static_cast<int>(PrintsAmong(names).size());
+    };
     OrderCompleteness counts;
+    const int all = static_cast<int>(PrintsAmong(present).size());
+    counts.present = whole(present);
+    counts.marked = whole(marked);
+    counts.damaged = all - counts.present;
     if (log)
         counts.named = printsNamedBy(*log);
-    counts.present = static_cast<int>(PrintsAmong(present).size());
-    counts.marked = static_cast<int>(PrintsAmong(marked).size());
+    else if (counts.damaged > 0)
+        counts.named = all;
     return counts;
 }
 
-OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked) {
-    const QStringList present = files.names(folder.path(), u"*.jpp;*.prk"_s);
+OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked,
+                                          const QStringList& damagedNames) {
+    const QStringList present = files.names(folder.path(), printPatterns);
     const std::optional<OrderLog> log = ReadOrderLog(files, folder);
-    return of(log ? &*log : nullptr, present, marked);
+    return of(log ? &*log : nullptr, present, marked, damagedNames);
+}
+
+QStringList DamagedPrints(const Files& files, const OrderFolder& folder) {
+    const Result<OrderState> state = ReadOrderState(files, folder);
+    QStringList names = files.names(folder.path(), printPatterns);
+    names.removeIf([&](const QString& name) {
+        const Result<qint64> length = files.size(folder.filePath(name));
+        return length && *length > 0 && (!state || state->lengths.value(name, *length) == *length);
+    });
+    return names;
 }
 
 } // namespace lumora

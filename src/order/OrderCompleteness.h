@@ -12,12 +12,16 @@ class Files;
 class OrderFolder;
 struct OrderLog;
 
+inline const QString printPatterns = QStringLiteral("*.jpp;*.prk");
+
 // The prints of an order, counted in three places. A print in pieces counts when all its pieces are there.
 struct OrderCompleteness {
-    // Prints that the log names: its lines with a usable name, less the pictures that failed. No value without a log.
+    // Prints that the log names: its lines with a usable name, less the pictures that failed. Without a log no value,
+    // or where prints are damaged those of the folder.
     std::optional<int> named;
-    int present = 0; // in the folder
-    int marked = 0;  // among what is to be sent
+    int present = 0; // whole in the folder
+    int marked = 0;  // whole among what is to be sent
+    int damaged = 0; // in the folder, and not whole
     int sent() const { return std::min(present, marked); }
 
     enum class Verdict {
@@ -28,10 +32,17 @@ struct OrderCompleteness {
     };
     Verdict verdict() const;
 
-    static OrderCompleteness of(const OrderLog* log, const QStringList& present, const QStringList& marked);
+    // All are leaf names. damagedNames: by DamagedPrints; as built in nobody looks for them.
+    static OrderCompleteness of(const OrderLog* log, const QStringList& present, const QStringList& marked,
+                                const QStringList& damagedNames = {});
     // Reads log and names of the folder. marked: leaf names of the files to be sent.
-    static OrderCompleteness read(const Files& files, const OrderFolder& folder, const QStringList& marked);
+    static OrderCompleteness read(const Files& files, const OrderFolder& folder, const QStringList& marked,
+                                  const QStringList& damagedNames = {});
 };
+
+// Of the prints and pieces of the folder those that are empty, or of another length than they were prepared with, where
+// the order's state tells that.
+QStringList DamagedPrints(const Files& files, const OrderFolder& folder);
 
 // The prints among these leaf names, each once: print files, and complete families of pieces, numbered 1 to n without a
 // gap, with n at least the declared total less one. A file of an exact multiple of the segment declares one piece more

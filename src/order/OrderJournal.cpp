@@ -2,6 +2,7 @@
 
 #include "order/BasketLine.h"
 #include "order/OrderChoices.h"
+#include "order/OrderCompleteness.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
 #include "order/PictureMark.h"
@@ -99,6 +100,11 @@ Result<void> OrderJournal::prepared() {
     makeKnown();
     OrderState next = m_state;
     next.phase = Phase::Prepared;
+    next.lengths.clear();
+    for (const QString& name : m_files.names(m_folder.path(), printPatterns)) {
+        if (const Result<qint64> length = m_files.size(m_folder.filePath(name)))
+            next.lengths[name] = *length;
+    }
     return keep(next);
 }
 

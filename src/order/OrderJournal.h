@@ -29,7 +29,7 @@ public:
     // replaces: the folder of the order that this one is prepared again from, or empty.
     Result<void> begin(const SessionState& session, OrderState::Way way, const QStringList& lines,
                        const DrivePath& replaces = {});
-    // The log is written: the order is whole.
+    // The log is written: the order is whole. Keeps the lengths of its prints.
     Result<void> prepared();
     // The folder on the server is entered for sending; the basket is dropped, and with it what was kept aside for the
     // preparation. ours: this order has made it, or it is known to hold nothing of another order. An order that has

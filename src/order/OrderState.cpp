@@ -76,6 +76,14 @@ bool takeTruth(const QString& value, bool& taken) {
     return taken || value == u"no";
 }
 
+// The length, a blank, the leaf name.
+bool takeLength(QMap<QString, qint64>& lengths, const QString& value) {
+    bool isNumber = false;
+    const qint64 length = value.section(u' ', 0, 0).toLongLong(&isNumber);
+    lengths[value.section(u' ', 1)] = length;
+    return isNumber;
+}
+
 // False for a value that this version can't take.
 bool takeEntry(OrderState& state, const QString& key, const QString& value) {
     if (key == u"Phase")
@@ -110,6 +118,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.filesInHand += value;
     else if (key == u"Shoora")
         state.items += value;
+    else if (key == u"Length")
+        return takeLength(state.lengths, value);
     else if (key == u"Mark")
         state.marks += value;
     else if (key.startsWith(choicePrefix))
@@ -153,6 +163,8 @@ QByteArray OrderState::write() const {
         for (const auto& [key, value] : choices)
             writer.text(choicePrefix + key, value);
     }
+    for (auto length = lengths.cbegin(); length != lengths.cend(); ++length)
+        writer.text(u"Length"_s, QString::number(length.value()) + u' ' + length.key());
     if (phase <= Phase::Prepared) {
         for (const QString& item : items)
             writer.text(u"Shoora"_s, item);

@@ -5,6 +5,7 @@
 #include "session/SessionState.h"
 
 #include <QByteArray>
+#include <QMap>
 #include <QStringList>
 
 #include <optional>
@@ -46,9 +47,11 @@ struct OrderState {
     int filesInAll = 0;            // 0: not counted
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;
-    QString replaces;               // folder name of the order that this one was prepared again from
-    QStringList items;              // lines of the basket; kept until the sending begins
-    QStringList marks;              // PictureMark of each line's picture; none in a state of an older version
+    QString replaces;  // folder name of the order that this one was prepared again from
+    QStringList items; // lines of the basket; kept until the sending begins
+    QStringList marks; // PictureMark of each line's picture; none in a state of an older version
+    // Of the prints and pieces, by leaf name, in bytes: as they were prepared. None in a state of an older version.
+    QMap<QString, qint64> lengths;
     QList<ListOutputEntry> choices; // as OrderChoices has them; kept until the lab was told
     QList<ListOutputEntry> further; // keys that this version does not know, kept as they are
 

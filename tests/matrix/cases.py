@@ -43,6 +43,7 @@ class Workspace:
         self.home = self.data = folder / name    # where the program is started, and its data folder
         self.lab, self.out, self.runtime = folder / f'{name}.ini', folder / f'{name}.out', folder / f'{name}.runtime'
         self.program = None
+        self.damaged = set()    # names of files that count as lost here
         self.status, self.said, self.hurry = None, '', 1
 
     def make(self, pictures=None):
@@ -63,7 +64,7 @@ class Workspace:
         """Name -> bytes of all that has to arrive."""
         order = order or self.order()
         files = {path.name: path.read_bytes() for path in order.iterdir()
-                 if path.is_file() and path.name[0] != '.' and path.name not in OWN} if order else {}
+                 if path.is_file() and path.name[0] != '.' and path.name not in OWN and path.name not in self.damaged} if order else {}
         proof = self.data / '2000lumora/000.jpg'
         if self.way == 'ftp' and proof.is_file():
             files['000.jpg'] = proof.read_bytes()

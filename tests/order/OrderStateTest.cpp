@@ -48,6 +48,7 @@ TEST(AnOrderState, keepsEachStepOfTheSendingAndDropsTheBasketWhenItBegins) {
             state.filesSent = 3, state.filesInAll = 7;
         state.filesInHand = {u"C:\\a.jpp"_s, u"C:\\ב.jpp"_s};
         state.replaces = u"2026_11_21_KUP_1234^104"_s;
+        state.lengths = {{u"a b.jpp"_s, 5'000'000'000}, {u"c.jpp"_s, 0}};
         state.report = OrderState::Report::Begun;
         const OrderState back = parsed(state);
         if (phase >= Phase::Sending)
@@ -73,6 +74,7 @@ TEST(AnOrderState, isClearlyDamagedWhereverItIsCut) {
     const QByteArray damaged[] = {lacksALine,
                                   whole + "\"Phase\",\"arrived\"\r\n",
                                   "\"End\",0\r\n",
+                                  "\"Phase\",\"arrived\"\r\n\"Length\",\"x a.jpp\"\r\n\"End\",2\r\n",
                                   "\"Phase\",\"lost\"\r\n\"End\",1\r\n",
                                   "\"Phase\",\"arrived\"\r\n\"FolderMadeByUs\",\"-1\"\r\n\"End\",2\r\n",
                                   QByteArray(4096, '\0'),

@@ -48,6 +48,10 @@ TEST(FtpGuards, CarefullyAnOrderThatLacksPicturesLeavesOnlyAtTheCustomersWord) {
         int questions;
     };
     const auto onePrint = [](Guarded& order) { order.remove(FtpFrmRig::second()); };
+    const auto cut = [](Guarded& order) {
+        order.keep({}, false);
+        order.rig.write(FtpFrmRig::second(), "x");
+    };
     const auto sheetAlone = [](Guarded& order) { order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::sheet()}); };
     using enum SendingPhase;
     const Case cases[] = {
@@ -55,6 +59,8 @@ TEST(FtpGuards, CarefullyAnOrderThatLacksPicturesLeavesOnlyAtTheCustomersWord) {
         {"the whole choice cancelled", sheetAlone, {}, Refused, 1, 0},
         {"a picture is gone, no", onePrint, {false}, Refused, 0, 1},
         {"a picture is gone, yes", onePrint, {true}, Countdown, 0, 1},
+        {"a picture was cut, no", cut, {false}, Refused, 0, 1},
+        {"a picture was cut, yes", cut, {true}, Countdown, 0, 1},
         {"no log tells", [](Guarded& order) { order.remove(FtpFrmRig::log()); }, {}, Countdown, 0, 0},
     };
     for (const Case& each : cases) {

@@ -51,8 +51,9 @@ void MoogMeret::sendByMail() {
 bool MoogMeret::mayBeMailed() {
     const QStringList marked = LeafNames(List1.items());
     const OrderFolder order(m_files.folder());
-    m_walksWholeOrder =
-        OrderCompleteness::read(m_platform.files, order, marked).verdict() == OrderCompleteness::Verdict::Whole;
+    const QStringList damaged = m_state.Careful ? DamagedPrints(m_platform.files, order) : QStringList();
+    m_walksWholeOrder = OrderCompleteness::read(m_platform.files, order, marked, damaged).verdict() ==
+                        OrderCompleteness::Verdict::Whole;
     return CompletenessGuard(m_state, m_platform).maySend(order, marked) && mayAct();
 }
 

@@ -65,6 +65,16 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
             u"רשימת הקבצים מהשרת לא נכתבה במחשב זה. יש לפנות מקום בדיסק או לתקן את ההרשאות ולנסות שוב."_s,
             u"The server's list of files can't be written on this computer. Free some space or mend the "
             u"rights, then try again."_s);
+    case LineStep::KeepState:
+        return state.wording(
+            u"לא ניתן לרשום במחשב זה עד היכן הגיעה השליחה, ולכן היא הופסקה. ההזמנה שמורה. יש לפנות מקום בדיסק או לתקן "
+            u"את ההרשאות וללחוץ על הלחצן שלח שוב."_s,
+            u"How far the sending has come can't be written on this computer, so it has ended. The order is kept. Free "
+            u"some space or mend the rights, then press Send again."_s);
+    case LineStep::PrintCut:
+        return state.wording(u"הקובץ %1 נפגם במחשב זה לאחר שהוכן. יש להודיע לחנות."_s.arg(name),
+                             u"The file %1 was damaged on this computer after it was made. Please tell the "
+                             u"shop."_s.arg(name));
     case LineStep::ServerChanges:
         return state.wording(u"השרת של המעבדה משנה את הקבצים בדרך. יש להתקשר למעבדה."_s,
                              u"The lab's server changes files on the way. Please call the lab."_s);

@@ -230,8 +230,12 @@ void SendingPage::tellNotKept() const {
     m_platform.dialogs.message(wording(notKeptWords));
 }
 
-bool SendingPage::mayBeSent(const QStringList& paths) const {
-    return CompletenessGuard(m_state, m_platform).maySend(OrderFolder::chosen(m_state), LeafNames(paths));
+bool SendingPage::mayBeSent(const QStringList& paths) {
+    const OrderFolder order = OrderFolder::chosen(m_state);
+    const QStringList damaged = m_state.Careful ? DamagedPrints(m_platform.files, order) : QStringList();
+    if (!damaged.isEmpty())
+        tellReason(LineStep::PrintCut, {Failure::Kind::Damaged, damaged.join(u", "_s)}, damaged.first());
+    return CompletenessGuard(m_state, m_platform).maySend(order, LeafNames(paths));
 }
 
 bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken) {

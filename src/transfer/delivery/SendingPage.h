@@ -89,7 +89,7 @@ protected:
     // A step of the sending could not be kept in the order's folder.
     void tellNotKept() const;
     // Asked of the files that make up the chosen order; a question's loop may close the page.
-    bool mayBeSent(const QStringList& paths) const;
+    bool mayBeSent(const QStringList& paths);
     // The order's number is another order's on the server: follows the way to the page that prepares the order again
     // under another one. False where that is not possible; the page stays.
     bool prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken);

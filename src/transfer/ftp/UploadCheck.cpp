@@ -195,7 +195,8 @@ Arrival UploadCheck::orderThere() {
         return Arrival::Part;
     const std::optional<OrderLog> log = ReadOrderLog(m_files, order);
     const QStringList there = m_lists.List6.items();
-    return arrivalBy(OrderCompleteness::of(log ? &*log : nullptr, there, there).verdict());
+    return arrivalBy(
+        OrderCompleteness::of(log ? &*log : nullptr, there, there, DamagedPrints(m_files, order)).verdict());
 }
 
 Arrival UploadCheck::arrivalByNames() const {
@@ -205,7 +206,9 @@ Arrival UploadCheck::arrivalByNames() const {
 }
 
 OrderCompleteness UploadCheck::completeness() const {
-    return OrderCompleteness::read(m_files, OrderFolder(m_transfer.OrderFolder), LeafNames(m_lists.List4Makor.items()));
+    const OrderFolder order(m_transfer.OrderFolder);
+    return OrderCompleteness::read(m_files, order, LeafNames(m_lists.List4Makor.items()),
+                                   m_session.provesArrival() ? DamagedPrints(m_files, order) : QStringList());
 }
 
 Arrival UploadCheck::arrivalBy(OrderCompleteness::Verdict verdict) {

@@ -40,7 +40,8 @@ void HttpArrival::postUnconfirmed(const QString& path) {
 std::optional<OrderCompleteness> HttpArrival::lacking(const OrderFolder& order, const QStringList& names) const {
     if (!m_state.Careful)
         return std::nullopt;
-    const OrderCompleteness counts = OrderCompleteness::read(m_platform.files, order, names);
+    const OrderCompleteness counts =
+        OrderCompleteness::read(m_platform.files, order, names, DamagedPrints(m_platform.files, order));
     return counts.verdict() == OrderCompleteness::Verdict::Fewer ? std::optional(counts) : std::nullopt;
 }
 
