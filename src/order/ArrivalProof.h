@@ -8,6 +8,13 @@
 
 namespace lumora {
 
+// How much of an order its sending has brought to the server.
+enum class Arrival {
+    Whole,  // all that belongs to it
+    Agreed, // all files of its folder; the customer has agreed that its log names more pictures
+    Part,   // less, as a chosen part
+};
+
 // A file of an order as it lies here, and an entry of what the lab's server has: leaf names, lengths in bytes.
 struct LocalFile {
     QString name;

@@ -56,31 +56,37 @@ TEST(LabArea, TheFourListButtonsAreSafeInEachPhase) {
         int boxes;
     };
     constexpr After lists{Countdown, 5, 0, 0};
+    constexpr After part{Countdown, 3, 0, 0};
+    constexpr After sent{Success, 5, 0, 0};
     const struct {
+        const char* what;
         void (Area::*arrange)();
         SendingPhase phase;
         std::array<After, 4> after;
     } rows[] = {
-        {&Area::hasNoServer,
+        {"no server",
+         &Area::hasNoServer,
          NoServer,
          {{{NoServer, 0, 0, 2}, {NoServer, 0, 0, 2}, {NoServer, 0, 0, 2}, {NoServer, 0, 0, 2}}}},
-        {&Area::hasNoOrder,
+        {"no order",
+         &Area::hasNoOrder,
          NoOrder,
          {{{NoOrder, 0, 0, 0}, {NoOrder, 0, 0, 0}, {NoOrder, 0, 0, 1}, {NoOrder, 0, 0, 1}}}},
-        {&Area::counts, Countdown, {{lists, lists, {Countdown, 5, 0, 1}, {Success, 5, 5, 0}}}},
-        {&Area::waitsWithAPart, Waiting, {{lists, {Countdown, 3, 0, 0}, {Success, 3, 3, 0}, {Success, 3, 3, 0}}}},
-        {&Area::leavesRemains, NotAll, {{lists, lists, {NotAll, 1, 0, 1}, {Success, 1, 1, 0}}}},
-        {&Area::hasANameTwice, Unclear, {{lists, {Countdown, 3, 0, 0}, {NotAll, 3, 0, 0}, {Unclear, 0, 0, 1}}}},
-        {&Area::isStopped, Stopped, {{lists, lists, {Stopped, 5, 0, 1}, {Success, 5, 5, 0}}}},
-        {&Area::meetsAnotherOrder, CallLab, {{lists, lists, {CallLab, 5, 0, 1}, {CallLab, 5, 0, 0}}}},
-        {&Area::meetsAStranger,
+        {"the count runs", &Area::counts, Countdown, {{lists, lists, {Countdown, 5, 0, 1}, {Success, 5, 5, 0}}}},
+        {"a part waits", &Area::waitsWithAPart, Waiting, {{lists, part, {Success, 3, 3, 0}, {Success, 3, 3, 0}}}},
+        {"remains were left", &Area::leavesRemains, NotAll, {{lists, lists, {NotAll, 1, 0, 1}, {Success, 1, 1, 0}}}},
+        {"a name comes twice", &Area::hasANameTwice, Unclear, {{lists, part, {NotAll, 3, 0, 0}, {Unclear, 0, 0, 1}}}},
+        {"stopped", &Area::isStopped, Stopped, {{lists, lists, {Stopped, 5, 0, 1}, {Success, 5, 5, 0}}}},
+        {"another order", &Area::meetsAnotherOrder, CallLab, {{lists, lists, {CallLab, 5, 0, 1}, {CallLab, 5, 0, 0}}}},
+        {"a stranger",
+         &Area::meetsAStranger,
          AllThere,
          {{{AllThere, 5, 0, 1}, {AllThere, 5, 0, 1}, {AllThere, 5, 0, 0}, {AllThere, 5, 0, 0}}}},
-        {&Area::sends, Success, {{{Success, 5, 0, 1}, {Success, 5, 0, 1}, {Success, 5, 0, 0}, {Success, 5, 0, 0}}}},
+        {"sent", &Area::sends, Success, {{{Success, 5, 0, 1}, {Success, 5, 0, 1}, sent, sent}}},
     };
     for (const auto& row : rows) {
         for (std::size_t at = 0; at < row.after.size(); ++at) {
-            SCOPED_TRACE(std::to_string(&row - rows) + ", button " + std::to_string(at));
+            SCOPED_TRACE(std::string(row.what) + ", button " + std::to_string(at));
             Area area;
             (area.*row.arrange)();
             FtpFrm& page = area.page();

@@ -79,6 +79,8 @@ TEST(ServerListTest, ATextOf35CharactersIsNoListing) {
     EXPECT_EQ(ParseServerList(u"  "_s + text + u'\n'), QStringList());
     EXPECT_EQ(ParseServerList(u"2026_11_21_KUP_1234^105~~ab~~ ~~~~total:1"_s),
               QStringList({u"2026_11_21_KUP_1234^105"_s, u"ab"_s, u"total:1"_s}));
+    const QString marked = ServerText("\xEF\xBB\xBF" + (text + u"\r\n"_s).toLatin1());
+    EXPECT_EQ(ReadServerAnswer(marked, u"2026_11_21_KUP_1234^105"_s).files, QStringList(u"a"_s));
 }
 
 TEST(ServerListTest, AnEntryStrikesOneNameThatContainsItOrCarefullyIsIt) {

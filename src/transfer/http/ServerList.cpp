@@ -1,5 +1,6 @@
 #include "transfer/http/ServerList.h"
 
+#include "common/AnsiCodePage.h"
 #include "common/DrivePath.h"
 
 #include <algorithm>
@@ -12,6 +13,8 @@ namespace {
 
 constexpr qsizetype longestAnswer = 35;
 const QString total = u"total:"_s;
+const QString separator = u"~~"_s;
+const QByteArray byteOrderMark = "\xEF\xBB\xBF"_ba;
 
 bool namesTotal(const QString& entry) {
     return entry.contains(total, Qt::CaseInsensitive);
@@ -28,17 +31,24 @@ bool isServersList(const QString& name) {
     return isList;
 }
 
+// Not trimmed; no blank ones.
+QStringList splitList(const QString& text) {
+    QStringList entries = text.split(separator);
+    entries.removeIf([](const QString& entry) { return entry.trimmed().isEmpty(); });
+    return entries;
+}
+
 std::optional<QStringList> filesIn(const QString& answer, const QString& folderName) {
     QStringList names;
     bool hasFolder = false;
     bool hasTotal = false;
-    for (const QString& entry : answer.split(u"~~"_s)) {
+    for (const QString& entry : splitList(answer)) {
         const QString name = entry.trimmed();
         if (name == folderName)
             hasFolder = true;
         else if (namesTotal(name))
             hasTotal = true;
-        else if (!name.isEmpty() && !isServersList(name.toLower()))
+        else if (!isServersList(name.toLower()))
             names += name;
     }
     return hasFolder && (hasTotal || !names.isEmpty()) ? std::optional(names) : std::nullopt;
@@ -46,13 +56,15 @@ std::optional<QStringList> filesIn(const QString& answer, const QString& folderN
 
 } // namespace
 
+QString ServerText(const QByteArray& bytes) {
+    return AnsiCodePage::decode(bytes.startsWith(byteOrderMark) ? bytes.mid(byteOrderMark.size()) : bytes);
+}
+
 QStringList ParseServerList(const QString& text) {
     const QString whole = text.trimmed();
     if (whole.size() <= longestAnswer)
         return {};
-    QStringList entries = whole.split(u"~~"_s);
-    entries.removeIf([](const QString& entry) { return entry.trimmed().isEmpty(); });
-    return entries;
+    return splitList(whole);
 }
 
 QStringList MarkHossarim(const QStringList& files, const QStringList& entries, const QString& folderName,
@@ -74,7 +86,7 @@ QStringList MarkHossarim(const QStringList& files, const QStringList& entries, c
 
 bool TellsUnknownFolder(const QString& answer) {
     const QString text = answer.trimmed();
-    return hasNot(text) && text.size() <= longestAnswer && !text.contains(u'<') && !text.contains(u"~~"_s);
+    return hasNot(text) && text.size() <= longestAnswer && !text.contains(u'<') && !text.contains(separator);
 }
 
 ServerAnswer ReadServerAnswer(const QString& answer, const QString& folderName) {

@@ -1,11 +1,15 @@
 #pragma once
 
+#include <QByteArray>
 #include <QString>
 #include <QStringList>
 
 #include <optional>
 
 namespace lumora {
+
+// The text of a script's answer or of a list file, without the byte order mark that some scripts begin with.
+QString ServerText(const QByteArray& bytes);
 
 // The entries of a listing by the lab's scripts: names separated by "~~", among them the folder's name and "total:"
 // with a number. A text of at most 35 characters is no listing and has no entries.

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
+#include "order/ArrivalProof.h"
 #include "session/SessionState.h"
 #include "transfer/delivery/SendingPhase.h"
 
@@ -15,13 +16,6 @@ class ReportOnce;
 struct OrderState;
 struct Platform;
 struct SendingStop;
-
-// How much of an order its sending has brought to the server.
-enum class Arrival {
-    Whole,  // all that belongs to it
-    Agreed, // all files of its folder; the customer has agreed that its log names more pictures
-    Part,   // less, as a chosen part
-};
 
 // What follows an arrival, for both senders: it is kept in the order's state, then the lab is told of it. A telling
 // ends at the latest after two minutes, and within a second where it is stopped; it then counts as begun.
