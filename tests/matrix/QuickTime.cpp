@@ -1,6 +1,7 @@
 // Loaded in front of a program by LD_PRELOAD. Its monotonic clock, its waits and the limits of its sockets run
 // MATRIX_CLOCK times as fast; at rename MATRIX_KILL the program is killed, before it or, if the number is negative,
-// after it. The targets of all renames are written to the file MATRIX_RENAMES, a line each.
+// after it. The targets of all renames are written to the file MATRIX_RENAMES, a line each. A rename to a path that
+// ends in MATRIX_FULL finds the disk full.
 #include <dlfcn.h>
 #include <poll.h>
 #include <sys/epoll.h>
@@ -11,10 +12,12 @@
 
 #include <algorithm>
 #include <atomic>
+#include <cerrno>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <ctime>
+#include <string_view>
 
 namespace {
 
@@ -25,6 +28,7 @@ long number(const char* name) {
 const long hurry = std::max(1L, number("MATRIX_CLOCK"));
 const long killAt = number("MATRIX_KILL");
 const char* const renamesFile = std::getenv("MATRIX_RENAMES");
+const char* const full = std::getenv("MATRIX_FULL");
 std::atomic<long> renames = 0;
 constexpr long second = 1'000'000'000;     // nanoseconds
 constexpr time_t calendar = 1'000'000'000; // seconds; a later deadline is one of the calendar's clock
@@ -94,6 +98,10 @@ int rename(const char* from, const char* to) noexcept {
     const long count = ++renames;
     if (count == killAt)
         raise(SIGKILL);
+    if (full && std::string_view(to).ends_with(full)) {
+        errno = ENOSPC;
+        return -1;
+    }
     const int failed = next<decltype(rename)>("rename")(from, to);
     if (std::FILE* file = renamesFile ? std::fopen(renamesFile, "a") : nullptr) {
         std::fprintf(file, "%s\n", to);

@@ -168,6 +168,29 @@ def fewer_pictures(case):
     case.result += ', then ' + case.send_again('goon')
 
 
+def print_cut_here(case):
+    """A print is cut on this machine behind the preparation, and the customer agrees to send the order all the same."""
+    case.switches = 'Reports = no\n'
+    case.play('plain', 'prepared')
+    cut = next(path for path in case.mine.order().glob('*.jpp') if path.name[0] != '!')
+    cut.write_bytes(cut.read_bytes()[:1000])
+    case.mine.damaged.add(cut.name)
+    case.result = case.send_again('agreed', 'goon')
+
+
+def state_not_kept(prepared):
+    def plays(case):
+        """The disk has no room for the order's state while it is sent, then it has."""
+        case.play(case.order_of, prepared)
+        ended = case.play('goon', case.way, MATRIX_FULL='/.order')
+        arrived = ended and case.mine.told() == 'arrived'
+        case.result = case.verdict(ended)
+        case.found = case.beside(1 if arrived else 0)
+        if not arrived:
+            case.result += ', then ' + case.send_again('goon')
+    return plays
+
+
 # The third put is a print. Of a pair the first number is that with a session for each file, the second that with a session kept.
 PRINT = 3
 MIDDLE = (12, 6)    # a listing of the order's folder with files in it
@@ -273,6 +296,8 @@ FTP = [
     Fault('sent again without its state, its log withheld at first', plays=without_state, only=('scripted',), acts={
         'STOR': (reply('553 Could not create file'), ALWAYS, PRINT), 'RETR': (reply('425 Failed to establish connection'), 1)}),
     Fault('fewer pictures as agreed, no reports', plays=fewer_pictures, only=('scripted',)),
+    Fault('a print is cut here behind the preparation, as agreed', plays=print_cut_here, only=('scripted',), heals=False),
+    Fault('no room for the state while the order is sent', plays=state_not_kept('prepared'), only=('scripted',), quick=True),
 ]
 
 
@@ -413,6 +438,7 @@ HTTP = [
           {'MAKELIST': lists(lambda entries: [*entries[:-1], 'jpp', 'jpp', 'txt', entries[-1]]), 'POST': (says(b'error=7'), ALWAYS, 3)}),
     Fault('list with names in capitals', {'MAKELIST': lists(lambda entries: [*entries[:1], *map(str.upper, entries[1:-1]), entries[-1]])}),
     Fault('list without total', {'MAKELIST': (lists(lambda entries: entries[:-1]), 1, FIRST)}),
+    Fault('list that begins with a byte order mark', {'MAKELIST': lists(lambda entries: ['ï»¿' + entries[0], *entries[1:]])}),
     Fault('list without the folder', {'MAKELIST': (lists(lambda entries: entries[1:]), 1, FIRST)}),
     Fault('list lacks a file, once', {'MAKELIST': (lists(lambda entries: [*entries[:2], *entries[3:]]), 1, FIRST)}, again=1),
     Fault('list: redirect', {'FETCH': lambda session: session.answer(b'', 302, Location=session.path + '?again') or True
@@ -434,6 +460,7 @@ HTTP = [
     Fault('no HEAD, half of a file stored', {'HEAD': says(b'', 405), 'POST': (stored(half), 1, 2)}, literal='no length is to be had'),
     Fault('another order in the folder', {'MAKELIST': (foreign_folder, 1)}, quick=True),
     Fault("killed behind the last file, another order's log there", {'POST': (stored_and_cut(kills=True), 1, 5)}, plays=other_log),
+    Fault('no room for the state while the order is sent', plays=state_not_kept('prepared-web')),
     Fault('report: 500', {'REPORT': says(b'', 500), 'DONE': says(b'', 500)}),
     Fault('report: silence', {'REPORT': silent, 'DONE': silent}, clock=60, limit=120),
     Fault('report: line cut', {'REPORT': drops, 'DONE': drops}),

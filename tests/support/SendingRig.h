@@ -37,6 +37,14 @@ struct SendingRig : PageRig {
         }
         return bytes;
     }
+    // False: no state of the order can be written any more.
+    void keepsState(bool kept) {
+        const DrivePath file = local(u".order"_s);
+        if (kept == test.files.folderExists(file))
+            (void)(kept ? test.files.removeTree(file) : test.files.removeFile(file));
+        if (!kept)
+            (void)test.files.makeFolder(file);
+    }
     template <class P>
     void registerPage() {
         PageRig::registerPage<P>(P::pageId);

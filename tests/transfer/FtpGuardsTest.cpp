@@ -194,6 +194,29 @@ TEST(FtpGuards, CarefullyAServerThatFallsSilentEndsTheSending) {
     }
 }
 
+TEST(FtpGuards, NothingIsPutBeforeItIsKept) {
+    for (const int putsBefore : {0, 1}) { // the disk is full
+        for (const bool careful : {true, false}) {
+            SCOPED_TRACE(std::to_string(putsBefore) + (careful ? ", careful" : ""));
+            Guarded order(careful);
+            order.rig.keepsState(putsBefore > 0);
+            order.lab.onPut = [&](const QString&) { order.rig.keepsState(false); };
+            order.rig.send();
+            FtpFrm& page = order.rig.page();
+            EXPECT_EQ(page.phase(), careful ? SendingPhase::NotAll : SendingPhase::Success);
+            EXPECT_EQ(order.rig.test.dialogs.messages.size(), careful ? 0 : 1) << "nothing goes on";
+            EXPECT_EQ(order.lab.puts.size(), careful ? putsBefore : 5);
+            EXPECT_EQ(page.controls().Label2.text.contains(u"לפנות מקום בדיסק"_s), careful);
+            if (!careful)
+                continue;
+            order.lab.onPut = {};
+            order.rig.keepsState(true);
+            page.Command10_Click();
+            EXPECT_EQ(page.phase(), SendingPhase::Success);
+        }
+    }
+}
+
 TEST(FtpGuards, AReportIsCutByAStopAndByTimeAndRepeatedByTheOperator) {
     const std::function<void(FtpFrm&)> ways[] = {[](FtpFrm& page) { page.Command15_Click(); },
                                                  [](FtpFrm& page) {

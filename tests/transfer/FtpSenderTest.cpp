@@ -180,7 +180,6 @@ TEST(FtpSender, EachFaultEndsInItsPhase) {
         qsizetype putsOfKept = puts; // where the session is kept
     } cases[] = {
         {"dots in the listing", [](Line& line) { line.lab.listsDots = true; }, Success, 1, 3},
-        {"a line of the listing can't be read", [](Line& line) { line.lab.unreadLine = u"?"_s; }, NotAll, 4, 3},
         // The 60 tries end within the third attempt.
         {"nobody answers until the fourth attempt", [](Line& line) { line.lab.deadConnects = 60; }, Success, 4, 3},
         {"folder can't be entered", [](Line& line) { line.lab.refusesEntry = true; }, NotAll, 4, 0},

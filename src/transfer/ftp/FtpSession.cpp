@@ -40,6 +40,7 @@ FtpSession::FtpSession(SessionState& state, const Platform& platform, SendingEve
                        FtpLists& lists)
     : m_profile(state.profile)
     , m_transfer(state.transfer)
+    , m_careful(state.Careful)
     , m_platform(platform)
     , m_events(events)
     , m_stop(stop)
@@ -63,6 +64,7 @@ void FtpSession::beginPass() {
     m_noInternetTold = false;
     m_noSessionTold = false;
     m_notKeptTold = false;
+    m_unkept.reset();
 }
 
 void FtpSession::takeSettings() {
@@ -209,7 +211,7 @@ bool FtpSession::insideOrderBase() const {
            (m_profile.FtpFolder1.isEmpty() ? m_profile.FtpFolder2 : m_profile.FtpFolder1 + u'/' + m_profile.FtpFolder2);
 }
 
-bool FtpSession::enterListedFolder(const QString& name) {
+bool FtpSession::enterListedFolder(const QString& name, bool made) {
     m_inOrderFolder = false;
     if (!hConnection)
         return false;
@@ -220,7 +222,7 @@ bool FtpSession::enterListedFolder(const QString& name) {
     }
     // Once a put was tried, a refused listing may hide what it left.
     listHere(m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused);
-    if (!bActiveSession || !mayJoin(name))
+    if (!bActiveSession || !mayJoin(name, made))
         return false;
     FillListFromNames(Target::List6, name);
     m_inFolder.clear();
@@ -253,11 +255,11 @@ bool FtpSession::lineEndsExplain(const ArrivalProof& proof, const QStringList& p
 }
 
 // Asked once an order; a folder of another order of a chain is only looked at.
-bool FtpSession::mayJoin(const QString& name) {
+bool FtpSession::mayJoin(const QString& name, bool made) {
     using Owner = FtpFolderOwner::Owner;
     if (!m_journal || m_journal->folder().name() != name || m_owner == Owner::Ours)
         return true;
-    if (m_made && (m_listing.refused || !m_listing.unread.isEmpty())) {
+    if (made && (m_listing.refused || !m_listing.unread.isEmpty())) {
         m_owner = Owner::Ours;
         return true;
     }
@@ -267,10 +269,13 @@ bool FtpSession::mayJoin(const QString& name) {
     return m_owner == Owner::Ours || m_owner == Owner::NotAsked;
 }
 
-bool FtpSession::joinOrderFolder(const QString& name) {
-    if (!enterListedFolder(name))
+bool FtpSession::joinOrderFolder(const QString& name, bool made) {
+    if (!enterListedFolder(name, made))
         return false;
-    keep(m_journal->sendingBegins(Sender::Ftp, m_owner == FtpFolderOwner::Owner::Ours));
+    if (!isKept(m_journal->sendingBegins(Sender::Ftp, m_owner == FtpFolderOwner::Owner::Ours))) {
+        m_inOrderFolder = false;
+        return false;
+    }
     tell(SendingMoment::Continuing);
     pump();
     tell(SendingMoment::Ready);
@@ -285,13 +290,14 @@ bool FtpSession::EnterOrderFolder() {
     }
     QString& name = m_transfer.ShemTikiya;
     name = OrderFolder(m_transfer.OrderFolder).name();
-    m_made = false;
     if (m_lists.List5.contains(name))
-        return joinOrderFolder(name);
+        return joinOrderFolder(name, false);
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
     m_inFolder.clear();
-    const bool made = m_made = FtpMakeOrderDir(name);
+    const bool made = FtpMakeOrderDir(name);
+    if (m_unkept)
+        return false;
     if (made && !m_folderOwner.asks()) {
         m_owner = FtpFolderOwner::Owner::Ours;
         keep(m_journal->sendingBegins(Sender::Ftp, true));
@@ -303,7 +309,7 @@ bool FtpSession::EnterOrderFolder() {
     }
     // It may have been there, though the listing above did not name it, also where its making was answered well.
     if (m_folderOwner.asks())
-        return joinOrderFolder(name);
+        return joinOrderFolder(name, made);
     const auto entered = hConnection->setCurrentDirectory(name);
     if (!entered) {
         trouble(LineStep::OrderFolder, entered.failure());
@@ -319,8 +325,8 @@ bool FtpSession::EnterOrderFolder() {
 
 bool FtpSession::FtpMakeOrderDir(const QString& name) {
     // After a program that ended before the answer, the next one finds an empty folder and takes it as the order's own.
-    if (hConnection)
-        keep(m_journal->folderIsAsked(Sender::Ftp));
+    if (hConnection && !isKept(m_journal->folderIsAsked(Sender::Ftp)))
+        return false;
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
         if (made.failure().kind == Failure::Kind::Refused || made.failure().kind == Failure::Kind::AccessDenied)
@@ -356,10 +362,11 @@ bool FtpSession::FtpSendFile(const QString& path) {
     m_putBegun = true;
     Result<void> sent = Failure{Failure::Kind::NotFound, path};
     if (local && files.fileExists(file)) {
-        keep(m_journal->take(path));
+        if (!isKept(m_journal->take(path)))
+            return false;
         sent = hConnection->put(*local, name);
         if (sent)
-            keep(m_journal->release(path));
+            release(path);
     }
     pump();
     if (sent)
@@ -381,6 +388,21 @@ void FtpSession::keepBrokenFiles() {
 void FtpSession::keep(const Result<void>& written) {
     if (!written && !std::exchange(m_notKeptTold, true))
         m_events.notKept(written.failure());
+}
+
+// As built in a step that could not be kept is told, and the sending goes on.
+bool FtpSession::isKept(const Result<void>& written) {
+    if (written || !m_careful) {
+        keep(written);
+        return true;
+    }
+    m_unkept = written.failure();
+    return false;
+}
+
+void FtpSession::release(const QString& path) {
+    if (const Result<void> written = m_journal->release(path); !m_careful)
+        keep(written);
 }
 
 void FtpSession::remove(const QString& remoteName) {

@@ -34,6 +34,10 @@ public:
     OrderJournal* journal() { return m_journal ? &*m_journal : nullptr; }
     // A step that could not be kept on this machine is told once a pass.
     void keep(const Result<void>& written);
+    // The put of this file was confirmed. With the guards a release that fails is not told: the next take is.
+    void release(const QString& path);
+    // Why a step of this pass could not be kept that has to be kept before the server hears of it: nothing was put.
+    const std::optional<Failure>& unkept() const { return m_unkept; }
     // Begins a pass: resets its counters, and failures that are told once a pass may be told again.
     void beginPass();
 
@@ -53,7 +57,8 @@ public:
     bool EnterOrderFolder();
     // Enters an order's folder that the server has and reads its names into List6. False on failure and where the
     // folder is another order's, with List6 unchanged.
-    bool enterListedFolder(const QString& name);
+    // made: the server has just answered well that it made the folder.
+    bool enterListedFolder(const QString& name, bool made = false);
     bool inOrderFolder() const { return m_inOrderFolder; }
     // What the listing at entering the folder proves of files of the order, by FtpArrival.
     bool provesArrival() const { return m_arrival.decides(); }
@@ -129,14 +134,16 @@ private:
     void ClearListing();
     Result<FtpListing> find(EmptyFolder empty = EmptyFolder::IsListed);
     void listHere(EmptyFolder empty);
-    bool joinOrderFolder(const QString& name);
-    bool mayJoin(const QString& name);
+    bool joinOrderFolder(const QString& name, bool made);
+    bool mayJoin(const QString& name, bool made);
+    bool isKept(const Result<void>& written);
     void take(const FtpListing& listing);
     void FtpFatalError(const Failure& failure, const QString& source);
     void listHereAgain();
 
     const ClientProfile& m_profile;
     TransferState& m_transfer;
+    const bool& m_careful;
     const Platform& m_platform;
     SendingEvents& m_events;
     SendingStop& m_stop;
@@ -144,7 +151,6 @@ private:
     std::optional<OrderJournal> m_journal;
     FtpFolderOwner m_folderOwner;
     FtpFolderOwner::Owner m_owner = FtpFolderOwner::Owner::NotKnown; // of the order's folder, until it is known
-    bool m_made = false; // the server has just answered well that it made the folder
     FtpArrival m_arrival;
     QList<RemoteFile> m_inFolder; // the files that List6 names
     FtpListing m_listing;         // that was read last
@@ -154,6 +160,7 @@ private:
     bool m_noInternetTold = false;
     bool m_noSessionTold = false;
     bool m_notKeptTold = false;
+    std::optional<Failure> m_unkept;
 };
 
 bool CheckFtpSettings(const ClientProfile& profile);

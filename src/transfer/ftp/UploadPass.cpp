@@ -73,6 +73,12 @@ void UploadPass::endSilent() {
     endBy(SendingPhase::NotAll, LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
 }
 
+// The end of a pass that could not keep what it was about to do.
+void UploadPass::endUnkept() {
+    if (m_session.unkept() && !m_stop.StopFlag)
+        endBy(SendingPhase::NotAll, LineStep::KeepState, *m_session.unkept());
+}
+
 void UploadPass::endStopped() {
     m_session.closeSession();
     UserStopped = 1;
@@ -134,6 +140,7 @@ bool UploadPass::reachOrderFolder() {
     m_events.reached(SendingMoment::WalkDone);
     if (m_stop.left)
         return false;
+    endUnkept();
     if (m_session.folderIsForeign() && !m_stop.StopFlag) {
         const bool basketKept = !m_session.journal()->state().items.isEmpty();
         const Failure why{Failure::Kind::InUse, u"the folder on the server holds another order"_s};
@@ -202,13 +209,14 @@ void UploadPass::confirm(const QString& path) {
     }
     m_inHand.removeAll(path);
     m_session.keepBrokenFiles();
-    m_session.keep(m_session.journal()->release(path));
+    m_session.release(path);
 }
 
 bool UploadPass::put(const QString& path, const QString& name) {
     TextList& broken = m_lists.List4Broken;
     BrokenBefore = broken.count();
     if (!m_session.FtpSendFile(path)) {
+        endUnkept();
         m_inHand.removeAll(path);
         if (broken.count() > BrokenBefore)
             m_session.keepBrokenFiles();

@@ -51,6 +51,7 @@ public:
 private:
     void endBy(SendingPhase end, LineStep step, const Failure& why);
     void endSilent();
+    void endUnkept();
     Failure changed();
     void tellPiece(int index);
     bool reachOrderFolder();

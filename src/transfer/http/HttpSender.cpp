@@ -1,6 +1,5 @@
 #include "transfer/http/HttpSender.h"
 
-#include "common/AnsiCodePage.h"
 #include "common/DrivePath.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderFolder.h"
@@ -46,6 +45,7 @@ public:
         , m_line(sender.m_platform) {
         sender.stop.StopFlag = false;
         sender.m_silent = false;
+        sender.m_unkept.reset();
         sender.m_silence.begin();
         sender.m_onLine = true;
     }
@@ -92,7 +92,7 @@ void HttpSender::HttpPause(int times) {
 
 QString HttpSender::FetchUrl(const QString& url) const {
     const auto answer = m_platform.internet.fetch(url);
-    return answer ? AnsiCodePage::decode(answer->body) : QString();
+    return answer ? ServerText(answer->body) : QString();
 }
 
 void HttpSender::BuildOrderFileList() {
@@ -116,6 +116,17 @@ void HttpSender::keep(const Result<void>& written) {
         return;
     m_notKeptTold = true;
     m_events.notKept(written.failure());
+}
+
+// As built in a step that could not be kept is told, and the sending goes on.
+bool HttpSender::isKept(const Result<void>& written) {
+    if (written || !m_state.Careful) {
+        keep(written);
+        return true;
+    }
+    m_unkept = written.failure();
+    stop.StopFlag = true;
+    return false;
 }
 
 void HttpSender::stopNow() {
@@ -145,6 +156,10 @@ std::optional<SendingPhase> HttpSender::endEarly() {
         return std::nullopt;
     stop.StopFlag = false;
     m_endedEarly = true;
+    if (m_unkept) {
+        m_events.failed(LineStep::KeepState, *m_unkept);
+        return SendingPhase::NotAll;
+    }
     if (!m_silent)
         return SendingPhase::Stopped;
     m_events.failed(LineStep::Silence, {Failure::Kind::TimedOut, u"the line was silent or too slow"_s});
@@ -192,8 +207,9 @@ std::optional<SendingPhase> HttpSender::sendMissing(int attempt) {
         if (stopped())
             break;
         if (i == 0 && m_journal)
-            keep(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
-        post(files[i]);
+            (void)isKept(m_journal->sendingBegins(Sender::Http, m_folderOwner.claims()));
+        if (!stopped())
+            post(files[i]);
         m_platform.pump.pump();
         m_events.progressed(i, lists.List4Hossarim.count());
         if (m_silence.over() && !stop.StopFlag)
@@ -225,7 +241,8 @@ void HttpSender::claimFolder() {
         HttpPause();
         if (stopped())
             return;
-        keep(m_journal->folderIsAsked(Sender::Http));
+        if (!isKept(m_journal->folderIsAsked(Sender::Http)))
+            return;
         m_silence.begin();
         m_left = lists.List4Hossarim.count();
         m_sent = lists.List4Kvazim.count() - m_left;
@@ -257,8 +274,8 @@ SendingPhase HttpSender::endLost() {
 void HttpSender::post(const QString& path) {
     const DrivePath folder = DrivePath(path).folder();
     const QString url = m_state.profile.HttpHost + m_state.profile.HttpScriptPath + u"getfile2.php"_s;
-    if (m_journal)
-        keep(m_journal->take(path));
+    if (m_journal && !isKept(m_journal->take(path)))
+        return;
     m_arrival.postBegins(path);
     lists.TxtWeb = m_script.MultipartPost(folder.leaf(), {path}, url, folder, lists.TxtUrl, {}, {});
     const bool cut = m_script.failed() && !m_script.failedBeforeSending();
@@ -268,8 +285,11 @@ void HttpSender::post(const QString& path) {
         m_arrival.postUnconfirmed(path);
     else if (!m_script.failed())
         m_arrival.postConfirmed(path);
+    Result<void> released;
     if (m_journal && !unconfirmed && !m_arrival.isLeftBehind(path))
-        keep(m_journal->release(path));
+        released = m_journal->release(path);
+    if (!m_state.Careful) // with the guards the next take tells it
+        keep(released);
     m_silence.connectsTimedOut(cut && isTimeOut(m_script.lastFailure()));
     m_events.reached(SendingMoment::Answered);
     if (!m_script.failed()) {
@@ -371,7 +391,7 @@ ServerVerdict HttpSender::CheckOrderOnServer(int listNumber) {
     if (lists.List4Kvazim.isEmpty() || !OrderFolder(order).isChosen() ||
         DrivePath(lists.List4Kvazim.item(0)).folder().leaf() != name)
         return ServerVerdict::OtherFolder;
-    HttpFetchFileListN(listNumber);
+    m_folderAnswer = HttpFetchFileListN(listNumber);
     if (stopped())
         return ServerVerdict::NotVerified;
     readListInOrder();
@@ -394,7 +414,7 @@ void HttpSender::readListInOrder() {
     lists.ListInOrder.append(ParseServerList(lists.TxtFromWeb));
 }
 
-void HttpSender::HttpFetchFileListN(int listNumber) {
+QString HttpSender::HttpFetchFileListN(int listNumber) {
     const Files& files = m_platform.files;
     if (!files.folderExists(WorkspacePaths::root(m_state)))
         (void)files.makeFolder(WorkspacePaths::root(m_state));
@@ -403,22 +423,26 @@ void HttpSender::HttpFetchFileListN(int listNumber) {
     lists.TxtFromWeb.clear();
     HttpPause(2);
     const Result<WebAnswer> answer = m_platform.internet.fetch(listScript(folderName()));
-    lists.TxtWeb = answer ? AnsiCodePage::decode(answer->body) : QString();
-    m_folderAnswer = answer && answer->good() ? lists.TxtWeb : QString();
+    const QString script = answer ? ServerText(answer->body) : QString();
+    lists.TxtWeb = script;
     m_events.reached(SendingMoment::Answered);
     HttpPause(3);
     m_platform.pump.pump();
     HttpPause();
-    if (!stopped())
-        downloadList(listNumber);
-    // Without the script's answer the list file is of an earlier time.
-    if (!answer || !answer->good())
-        m_folderAnswer.clear();
+    const std::optional<QString> list = stopped() ? std::nullopt : downloadList(listNumber);
+    if (list)
+        lists.TxtFromWeb = lists.TxtWeb = *list;
     m_events.reached(SendingMoment::Answered);
     HttpPause(2);
+    // Without the script's answer the list file is of an earlier time.
+    if (!answer || !answer->good())
+        return {};
+    // A list file lies in the folder: only the script can tell that there is no folder.
+    return list && !TellsUnknownFolder(*list) ? *list : script;
 }
 
-void HttpSender::downloadList(int listNumber) {
+// The list file's text; no value where there is none.
+std::optional<QString> HttpSender::downloadList(int listNumber) {
     const Files& files = m_platform.files;
     clsDownload download(m_platform);
     // A list from an earlier check must not be read as the answer to this one.
@@ -439,14 +463,10 @@ void HttpSender::downloadList(int listNumber) {
     m_platform.pump.pump();
     HttpPause(3);
     const auto size = files.size(list);
-    if (cleared && size && *size <= largestList) {
-        if (const auto text = files.read(list)) {
-            lists.TxtFromWeb = lists.TxtWeb = AnsiCodePage::decode(*text);
-            // A list file lies in the folder: only the script can tell that there is no folder.
-            if (!TellsUnknownFolder(lists.TxtWeb))
-                m_folderAnswer = lists.TxtWeb;
-        }
-    }
+    if (!cleared || !size || *size > largestList)
+        return std::nullopt;
+    const auto text = files.read(list);
+    return text ? std::optional(ServerText(*text)) : std::nullopt;
 }
 
 std::optional<OrderCompleteness> HttpSender::lacking() const {
@@ -459,9 +479,8 @@ std::optional<bool> HttpSender::hasFolder(const QString& name) {
     const OnLine line(*this);
     const Result<WebAnswer> answer = m_platform.internet.fetch(listScript(name));
     m_platform.pump.pump();
-    return answer && answer->good() && !stopped()
-               ? std::optional(!TellsUnknownFolder(AnsiCodePage::decode(answer->body)))
-               : std::nullopt;
+    return answer && answer->good() && !stopped() ? std::optional(!TellsUnknownFolder(ServerText(answer->body)))
+                                                  : std::nullopt;
 }
 
 bool HttpSender::onlyReportIsLeft() const {

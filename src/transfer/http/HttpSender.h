@@ -60,7 +60,8 @@ public:
     std::optional<SendingPhase> findMissing();
     // Asks the server. listNumber: the list file to download, 0 to 3; none for any other number.
     ServerVerdict CheckOrderOnServer(int listNumber);
-    void HttpFetchFileListN(int listNumber);
+    // The answer that may tell whose the order's folder is; empty where the script answered badly.
+    QString HttpFetchFileListN(int listNumber);
     // Fills ListInOrder from the list file.
     void readListInOrder();
 
@@ -119,8 +120,10 @@ private:
     void endSilent();
     std::optional<SendingPhase> endEarly();
     void keep(const Result<void>& written);
+    // A step that has to be kept before the server hears of it. False: the sending ends.
+    bool isKept(const Result<void>& written);
     void post(const QString& path);
-    void downloadList(int listNumber);
+    std::optional<QString> downloadList(int listNumber);
     void tellMissing();
     LineStep listTrouble() const;
     QString folderName() const;
@@ -143,6 +146,7 @@ private:
     bool m_lost = false;             // another order has taken the folder since
     bool m_onLine = false;           // a sending or a check runs
     bool m_silent = false;           // the line was cut because nothing moved on it
+    std::optional<Failure> m_unkept; // why a step could not be kept that the sending has ended for
     bool m_endedEarly = false;
     int m_namesAsked = 0; // of folders, for a free number
     int m_listNumber = HttpListGuard::first;
@@ -150,8 +154,8 @@ private:
     int m_left = 0;                                       // files of the pass not yet posted
     int m_sent = 0;                                       // files of the order answered well or found there
     bool m_allPosted = true;                              // every file of the last pass was posted
-    QString m_folderAnswer; // the last one that may tell whose the folder is; none where the server answered badly
-    Failure m_listFailure;  // failure of the last list file's download; no message after success
+    QString m_folderAnswer;                               // of the last check, by HttpFetchFileListN
+    Failure m_listFailure; // failure of the last list file's download; no message after success
 };
 
 } // namespace lumora
