@@ -110,16 +110,17 @@ FAULTS = {
     'src/order/BrokenFiles.cpp': [
         F('LeafName(path) == leafName', 'path == leafName', 'a broken file counts as arrived'),
         F('AnsiCodePage::encode(path) + "\\r\\n"', 'AnsiCodePage::encode(path)', 'two broken files become one name')],
-    'src/order/OrderLog.cpp': [
+    'src/order/OrderFields.cpp': [
         F('&shemot.n2', '&shemot.n3', 'the lab calls the address'),
         F('u"Shemot.TotalPics"_s', 'u"TotalPics"_s', 'the lab reads no total'),
+        F('album.Tosafot1[i - 1]', 'album.Tosafot1[i]', 'extras of an album move by one')],
+    'src/order/OrderLog.cpp': [
         F('u"fail_"_s', 'u"fail"_s', 'failed pictures are not read'),
         F('QString::number(failed.size())', 'QString::number(0)', 'the log hides that pictures are missing'),
         F('Fixed{u"5"_s}', 'Fixed{u"2"_s}', 'the lab refuses edited orders'),
         F('album ? Lines{zeros, zeros} : Lines{zeros}', 'Lines{zeros}', 'an album is read as a plain order'),
         F('album ? QString() : u"Shemot."_s', 'QString()', 'the key of the version is another'),
         F("QString(45, u'*')", "QString(44, u'*')", 'the line above the failed pictures is another'),
-        F('album.Tosafot1[i - 1]', 'album.Tosafot1[i]', 'extras of an album move by one'),
         F('Optint = OrderKind::EditedPrint;', '', 'an edited order that is read back counts as plain')],
     'src/order/EditRecord.cpp': [
         F('record.mid(column.position - 1, column.width)', 'record.mid(column.position, column.width)', 'each field is read a column too far'),
@@ -348,7 +349,7 @@ FAULTS = {
         F('m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused', 'EmptyFolder::MayBeRefused',
           'a refused listing hides what a cut put left'),
         F('m_lists.List4Broken.append(path);', '', 'a cut put is not removed'),
-        F('keep(m_journal->take(path));', '', 'after a kill a part counts as the file')],
+        F('isKept(m_journal->take(path))', 'true', 'after a kill a part counts as the file')],
     'src/transfer/ftp/UploadCheck.cpp': [
         F('nothingBroken() || !m_freshListing', 'nothingBroken()', 'an old listing confirms that remains are gone', seen=True),
         F('unreadable = !m_session.unreadLine().isEmpty();', 'unreadable = false;', 'a listing that can not be read proves the order'),
@@ -370,7 +371,7 @@ FAULTS = {
         F('!inPieces || IsPiece(name)', 'true', 'an order in pieces goes whole too')],
     'src/transfer/delivery/SilenceLimit.cpp': [
         F('m_silentFiles >= mostSilentFiles || m_tooSlow', 'm_tooSlow', 'a dead server holds the customer for hours'),
-        F('gap < 0 || gap > longestGap', 'false', 'a clock that was set ends the sending')],
+        F('std::min<std::chrono::milliseconds>(running - *m_told, longestGap)', 'running - *m_told', 'a machine that slept ends the sending')],
     'src/transfer/delivery/PreparedAgain.cpp': [F('m_state = before;', '', 'after a failure the next order has choices of this one')],
     'src/transfer/delivery/Attempts.cpp': [F('attempt <= attempts', 'attempt < attempts', 'one attempt less')],
     'src/transfer/http/HttpArrival.cpp': [
@@ -385,7 +386,7 @@ FAULTS = {
         F('m_arrival.postUnconfirmed(path);', '', 'a post without an answer is not looked at'),
         F('cut || m_script.refused()', 'cut', 'a post that the server refused counts as taken'),
         F('files.fileExists(list) ? files.removeFile(list) : Result<void>()', 'Result<void>()', 'a list of an earlier check is believed'),
-        F('keep(m_journal->folderIsAsked(Sender::Http));', '', 'after a kill the own folder counts as foreign')],
+        F('isKept(m_journal->folderIsAsked(Sender::Http))', 'true', 'after a kill the own folder counts as foreign')],
     'src/transfer/http/ServerList.cpp': [
         F('namesTotal(entry) || entry == folderName.toLower()', 'namesTotal(entry)', 'the name of the folder counts for the log'),
         F('given.trimmed().toLower()', 'given.trimmed()', 'a server that changes letters gets the order again and again'),
