@@ -3,12 +3,12 @@
 #include "platform/line/PocoInternet.h"
 #include "support/FakeLab.h"
 #include "support/LabServers.h"
-#include "support/TcpRelay.h"
 
 #include <Poco/Net/ServerSocket.h>
 #include <Poco/Net/StreamSocket.h>
 
 #include <QElapsedTimer>
+#include <QProcess>
 #include <QTemporaryDir>
 #include <QTimer>
 
@@ -228,11 +228,42 @@ INSTANTIATE_TEST_SUITE_P(Labs, FtpContract, ::testing::ValuesIn(labs()),
 
 // --- A line with faults in front of the lab's server ---
 
+class FaultyLine {
+public:
+    explicit FaultyLine(quint16 serverPort) {
+        m_program.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+        m_program.start(QStringLiteral(LUMORA_FAULTY_LINE), {QString::number(serverPort)});
+        m_port = toldNumber();
+    }
+    ~FaultyLine() {
+        m_program.closeWriteChannel();
+        m_program.waitForFinished(5'000);
+    }
+    QString host() const { return u"127.0.0.1:%1"_s.arg(m_port); }
+    // A fault as that program takes it; empty: a good line. Returns how often the fault before has struck.
+    int set(const QByteArray& fault) {
+        m_program.write(fault + '\n');
+        return toldNumber();
+    }
+
+private:
+    int toldNumber() {
+        while (!m_program.canReadLine()) {
+            if (!m_program.waitForReadyRead(30'000))
+                return -1;
+        }
+        return m_program.readLine().trimmed().toInt();
+    }
+
+    QProcess m_program;
+    int m_port = 0;
+};
+
 class FtpTest : public ::testing::Test {
 protected:
     QTemporaryDir local;
     LabServers lab;
-    TcpRelay relay{lab.ftpPort()};
+    FaultyLine relay{lab.ftpPort()};
     PocoInternet internet;
 
     void SetUp() override { ASSERT_TRUE(lab.running()) << lab.failure().toStdString(); }
@@ -253,7 +284,7 @@ TEST_F(FtpTest, FailsAtOnceWhereNobodyListensAndWithinTheLimitWhereNobodyAnswers
     const auto closed = internet.connectFtp(u"127.0.0.1:%1"_s.arg(FreePort()), u"a"_s, u"b"_s, DataChannel::Passive);
     ASSERT_FALSE(closed);
     EXPECT_EQ(closed.failure().kind, Failure::Kind::Disconnected);
-    relay.setFaults({.delayReplies = std::chrono::milliseconds(3000)});
+    relay.set("GREETING 1 late(3)");
     PocoInternet brief(TimeLimits{Poco::Timespan(30, 0), Poco::Timespan(0, 300'000)});
     const auto mute = brief.connectFtp(relay.host(), u"a"_s, u"b"_s, DataChannel::Passive);
     ASSERT_FALSE(mute);
@@ -265,37 +296,34 @@ TEST_F(FtpTest, FailsAtOnceWhereNobodyListensAndWithinTheLimitWhereNobodyAnswers
 TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
     const struct {
         const char* name;
-        TcpRelay::Faults faults;
+        const char* fault;
         Failure::Kind kind;
         int bytes;
     } cases[] = {
-        {"cut in the middle", {.cutDataAfter = 300'000, .times = 1}, Failure::Kind::Refused, 3'000'000},
-        {"cut behind what fits the buffers", {.cutDataAfter = 100, .times = 1}, Failure::Kind::Refused, 5'000},
-        {"stalled", {.stallDataAfter = 300'000, .times = 1}, Failure::Kind::TimedOut, 9'000'000},
-        {"closing reply bad", {.closingReply = "451 Disk full", .times = 1}, Failure::Kind::Refused, 5'000},
-        {"closing reply never comes", {.holdClosingReply = true, .times = 1}, Failure::Kind::TimedOut, 5'000},
-        {"cut with a good reply",
-         {.cutDataAfter = 300'000, .serverSeesEnd = true, .times = 1},
-         Failure::Kind::Disconnected,
+        {"cut in the middle", "STOR 1 passed(cut=300_000)", Failure::Kind::Refused, 3'000'000},
+        {"cut behind what fits the buffers", "STOR 1 passed(cut=100)", Failure::Kind::Refused, 5'000},
+        {"stalled", "STOR 1 passed(stall=300_000)", Failure::Kind::TimedOut, 9'000'000},
+        {"closing reply bad", "STOR 1 closing('451 Disk full')", Failure::Kind::Refused, 5'000},
+        {"closing reply never comes", "STOR 1 hang_before_the_end", Failure::Kind::TimedOut, 5'000},
+        {"cut with a good reply", "STOR 1 passed(cut=300_000, reset_server=False)", Failure::Kind::Disconnected,
          3'000'000},
-        {"closing reply lost", {.loseClosingReply = true, .times = 1}, Failure::Kind::Disconnected, 5'000},
-        {"put refused", {.command = "STOR", .reply = "552 Quota exceeded", .times = 1}, Failure::Kind::Refused, 5'000},
-        {"too many", {.command = "STOR", .reply = "421 Too many", .times = 1}, Failure::Kind::Refused, 5'000},
-        {"control cut", {.command = "STOR", .cutAtCommand = true, .times = 1}, Failure::Kind::Disconnected, 5'000},
+        {"closing reply lost", "STOR 1 closing('')", Failure::Kind::Disconnected, 5'000},
+        {"put refused", "STOR 1 reply('552 Quota exceeded')", Failure::Kind::Refused, 5'000},
+        {"too many", "STOR 1 reply('421 Too many')", Failure::Kind::Refused, 5'000},
+        {"control cut", "STOR 1 cut", Failure::Kind::Disconnected, 5'000},
     };
     // Long enough for a busy machine's server to let the client in, and short enough to wait for.
     PocoInternet shortOfPatience(TimeLimits{Poco::Timespan(30, 0), Poco::Timespan(3, 0)});
     for (const auto& each : cases) {
         SCOPED_TRACE(each.name);
-        relay.setFaults(each.faults);
-        const int before = relay.faultsMade();
+        relay.set(each.fault);
         auto ftp = connect(each.kind == Failure::Kind::TimedOut ? shortOfPatience : internet);
         ASSERT_TRUE(ftp);
         const QByteArray bytes = anyBytes(each.bytes);
         const QString name = QString::fromLatin1(each.name) + u".jpp"_s;
         const auto sent = ftp->put(write(local, "x", bytes), name);
         EXPECT_FALSE(sent);
-        EXPECT_EQ(relay.faultsMade(), before + 1);
+        EXPECT_EQ(relay.set({}), 1);
         if (sent)
             continue;
         EXPECT_EQ(sent.failure().kind, each.kind) << sent.failure().message.toStdString();
@@ -309,29 +337,29 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
 }
 
 TEST_F(FtpTest, ReadsRepliesOfManyLinesThatComeLate) {
-    relay.setFaults({.delayReplies = std::chrono::milliseconds(30), .manyLines = true});
+    relay.set("EACH 999 lambda session, line: time.sleep(0.03) or session.forward(line, answer=many_lines)");
     auto ftp = connect();
     ASSERT_TRUE(ftp);
     ASSERT_TRUE(ftp->put(write(local, "x", "xx"), u"x.jpp"_s));
     EXPECT_EQ(ftp->list(u"*.*"_s)->entries.size(), 1U);
     EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234"_s);
     EXPECT_FALSE(ftp->remove(u"none"_s));
-    EXPECT_EQ(ftp->lastResponse().count(u'\n'), 2);
+    EXPECT_EQ(ftp->lastResponse().count(u'\n'), 3);
 }
 
 TEST_F(FtpTest, TellsARefusedListingFromAnEmptyFolderAndEncryptionFromAWrongPassword) {
     auto ftp = connect();
     ASSERT_TRUE(ftp);
     for (const char* reply : {"550 No files found", "450 No files found", "426 Cut"}) {
-        relay.setFaults({.command = "LIST", .reply = reply});
+        relay.set("LIST 2 reply('" + QByteArray(reply) + "')");
         EXPECT_FALSE(ftp->list(u"*.*"_s)) << reply;
         EXPECT_EQ(ftp->list(u"*.*"_s, EmptyFolder::MayBeRefused).ok(), reply[1] == '5') << reply;
     }
-    relay.setFaults({.command = "EPSV", .reply = "550 No port", .times = 1});
+    relay.set("EPSV 1 reply('550 No port')");
     EXPECT_TRUE(ftp->list(u"*.*"_s, EmptyFolder::MayBeRefused));
     for (const char* reply : {"530 Non-anonymous sessions must use encryption.", "550 SSL/TLS required",
                               "534 Policy requires SSL", "421 Sorry, cleartext sessions are not accepted"}) {
-        relay.setFaults({.command = "USER", .reply = reply, .times = 1});
+        relay.set("USER 1 reply('" + QByteArray(reply) + "')");
         const auto refused = internet.connectFtp(relay.host(), u"ftp"_s, u"x"_s, DataChannel::Passive);
         ASSERT_FALSE(refused);
         EXPECT_EQ(refused.failure().kind, Failure::Kind::Unsupported) << reply;
@@ -356,24 +384,22 @@ TEST_F(FtpTest, AnAbortEndsEveryWait) {
     };
     const struct {
         const char* name;
-        TcpRelay::Faults faults;
+        const char* fault;
         std::function<bool(FtpConnection&)> wait;
     } cases[] = {
-        {"connect", {}, [&](FtpConnection&) { return reaches(u"127.0.0.1:%1"_s.arg(full.address().port())); }},
-        {"list", {.stallDataAfter = 0, .times = 1}, [](FtpConnection& ftp) { return ftp.list(u"*.*"_s).ok(); }},
-        {"put",
-         {.stallDataAfter = 300'000, .times = 1},
+        {"connect", "", [&](FtpConnection&) { return reaches(u"127.0.0.1:%1"_s.arg(full.address().port())); }},
+        {"put", "STOR 1 passed(stall=300_000)",
          [&](FtpConnection& ftp) { return ftp.put(large, u"stalled.jpp"_s).ok(); }},
-        {"closing reply",
-         {.holdClosingReply = true, .times = 1},
+        {"list", "LIST 1 passed(stall=0)", [](FtpConnection& ftp) { return ftp.list(u"*.*"_s).ok(); }},
+        {"closing reply", "STOR 1 hang_before_the_end",
          [&](FtpConnection& ftp) { return ftp.put(write(local, "y", "y"), u"held.jpp"_s).ok(); }},
-        {"name server", {}, [&](FtpConnection&) { return reaches(u"ftp.invalid"_s); }},
+        {"name server", "", [&](FtpConnection&) { return reaches(u"ftp.invalid"_s); }},
     };
     for (const auto& each : cases) {
-        relay.setFaults({});
+        relay.set({});
         auto ftp = connect();
         ASSERT_TRUE(ftp);
-        relay.setFaults(each.faults);
+        relay.set(each.fault);
         QElapsedTimer waiting;
         QTimer aborting;
         aborting.callOnTimeout([&] {

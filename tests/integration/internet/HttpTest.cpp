@@ -2,7 +2,6 @@
 #include "platform/line/PocoInternet.h"
 #include "support/LabServers.h"
 #include "support/ScriptedServer.h"
-#include "support/TcpRelay.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -12,6 +11,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <functional>
 #include <mutex>
 #include <vector>
 
@@ -55,6 +55,24 @@ private:
     QByteArrayList m_requests;
     ScriptedServer m_server{[this](Poco::Net::StreamSocket& line) { answer(line); }};
 };
+
+// Answers with these bytes of an answer, and then cuts the line or stands still until the other side ends it.
+enum class Then { Cut, StandStill };
+std::function<void(Poco::Net::StreamSocket&)> answering(const QByteArray& bytes, Then then) {
+    return [=](Poco::Net::StreamSocket& line) {
+        std::array<char, 4096> part;
+        line.receiveBytes(part.data(), static_cast<int>(part.size()));
+        line.sendBytes(bytes.constData(), static_cast<int>(bytes.size()));
+        line.setReceiveTimeout(Poco::Timespan(60, 0));
+        while (then == Then::StandStill && line.receiveBytes(part.data(), static_cast<int>(part.size())) > 0) {
+        }
+        line.setLinger(true, 0);
+    };
+}
+
+QString addressOf(const ScriptedServer& server) {
+    return u"http://127.0.0.1:%1/x"_s.arg(server.port());
+}
 
 QByteArray redirect(int status, const QByteArray& location) {
     return "HTTP/1.1 " + QByteArray::number(status) + " Moved\r\nLocation: " + location +
@@ -118,12 +136,11 @@ TEST_F(HttpTest, FailsClearlyWhereThereIsNoAnswer) {
 }
 
 TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatWasCutOrStoodStill) {
-    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
-    const QString url = u"http://%1/nothing"_s.arg(relay.host());
-    relay.setFaults({.cutDataAfter = 40, .times = 1});
-    EXPECT_FALSE(internet.download(url, target));
-    relay.setFaults({.stallDataAfter = 40, .times = 1});
-    const auto stalled = brief.fetch(url);
+    const QByteArray half = "HTTP/1.1 200 OK\r\nContent-Length: 100\r\n\r\nhalf";
+    const ScriptedServer cuts(answering(half, Then::Cut));
+    EXPECT_FALSE(internet.download(addressOf(cuts), target));
+    const ScriptedServer standsStill(answering(half, Then::StandStill));
+    const auto stalled = brief.download(addressOf(standsStill), target);
     ASSERT_FALSE(stalled);
     EXPECT_EQ(stalled.failure().kind, Failure::Kind::TimedOut) << stalled.failure().message.toStdString();
     EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
@@ -193,10 +210,8 @@ TEST_F(HttpTest, TellsALengthByHead) {
 TEST_F(HttpTest, AnAbortEndsACall) {
     QtEventPump pump;
     internet.pumpWhileWaiting(&pump);
-    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
-    const QString url = u"http://%1/x"_s.arg(relay.host());
+    const ScriptedServer server(answering("HTTP/1.1 2", Then::StandStill));
     for (const bool post : {false, true}) {
-        relay.setFaults({.stallDataAfter = 10, .times = 1});
         QElapsedTimer waiting;
         QTimer aborting;
         aborting.callOnTimeout([&] {
@@ -205,7 +220,7 @@ TEST_F(HttpTest, AnAbortEndsACall) {
             internet.abort();
         });
         aborting.start(300);
-        EXPECT_FALSE(post ? internet.post(url, {}) : internet.fetch(url));
+        EXPECT_FALSE(post ? internet.post(addressOf(server), {}) : internet.fetch(addressOf(server)));
         ASSERT_TRUE(waiting.isValid()) << "it ended before the abort";
         EXPECT_LT(waiting.elapsed(), 15'000); // the limits themselves are far longer
     }
@@ -219,22 +234,21 @@ TEST_F(HttpTest, LeavesNoFileOfAnAnswerThatNeverEnds) {
         for (;;)
             line.sendBytes(block.data(), static_cast<int>(block.size()));
     });
-    const auto answer = internet.download(u"http://127.0.0.1:%1/x"_s.arg(endless.port()), target);
+    const auto answer = internet.download(addressOf(endless), target);
     ASSERT_FALSE(answer);
     EXPECT_EQ(answer.failure().kind, Failure::Kind::TooLarge) << answer.failure().message.toStdString();
     EXPECT_TRUE(std::filesystem::is_empty(toHostPath(local.path())));
 }
 
 TEST_F(HttpTest, LetsQueuedPaintingRunButNoTimerWhileItWaits) {
-    TcpRelay relay(lab.httpPort(), TcpRelay::Kind::Plain);
-    relay.setFaults({.stallDataAfter = 0, .times = 1});
+    const ScriptedServer server(answering({}, Then::StandStill));
     QObject page;
     bool painted = false;
     bool ticked = false;
     QMetaObject::invokeMethod(
         &page, [&] { painted = true; }, Qt::QueuedConnection);
     QTimer::singleShot(50, &page, [&] { ticked = true; });
-    EXPECT_FALSE(brief.fetch(u"http://%1/x"_s.arg(relay.host())));
+    EXPECT_FALSE(brief.fetch(addressOf(server)));
     EXPECT_TRUE(painted);
     EXPECT_FALSE(ticked);
 }
