@@ -34,12 +34,6 @@ public:
     QByteArray log() const;
 
 private:
-    // The path of the server's file.
-    QString configure() const;
-    bool makeCertificate();
-    // On other ports when one was taken meanwhile.
-    void start();
-
     QTemporaryDir m_folder;
     QProcess m_server;
     QString m_failure;
