@@ -41,15 +41,16 @@ Result<PrintFileContent> readFile(const QString& path, PrintFileShape shape) {
 int info(const QStringList& files, PrintFileShape shape) {
     int code = allWell;
     for (const QString& path : files) {
-        // The order sheet has the ending of a print file.
-        if (const Result<QByteArray> bytes = readHostFile(toHostPath(path)); bytes && checkWholeJpeg(*bytes)) {
-            out() << path << "\n  a plain picture, as an order sheet is: " << bytes->size() << " bytes" << Qt::endl;
-            continue;
-        }
+        // A picture with the pieces' numbers inside may decode, so that only the pieces tell a print file from a sheet.
         const Result<PrintFileContent> content = readFile(path, shape);
         if (!content) {
-            err() << content.failure().message << Qt::endl;
-            code = faultFound;
+            const Result<QByteArray> bytes = readHostFile(toHostPath(path));
+            if (bytes && checkWholeJpeg(*bytes)) {
+                out() << path << "\n  a plain picture, as an order sheet is: " << bytes->size() << " bytes" << Qt::endl;
+            } else {
+                err() << content.failure().message << Qt::endl;
+                code = faultFound;
+            }
             continue;
         }
         out() << path << '\n';
