@@ -30,7 +30,8 @@ TEST_F(TheEditor, carefullyPacksATurnAndAPlaceThatComeBackAsTheyWereSeen) {
     for (int move = 0; move < 20; ++move)
         editor.PicPic_MouseMove({1300, 130});
     editor.PicPic_MouseUp();
-    EXPECT_EQ(stored.last().mid(18, 8), u"674 350 "_s) << "it slides along the edge";
+    EXPECT_EQ(storedField(EditRecord::PanX) + storedField(EditRecord::PanY), u"674 350 "_s)
+        << "it slides along the edge";
 }
 
 TEST_F(TheEditor, carefullyPrintsTheFrameThatIsSeenAndNoOther) {
@@ -47,12 +48,12 @@ TEST_F(TheEditor, carefullyPrintsTheFrameThatIsSeenAndNoOther) {
         editor.Combo2_Click(0);
         editor.Misgerett_Click(false);
         EXPECT_GT(corner().red(), 240);
-        EXPECT_EQ(stored.last().mid(32, 3), careful ? u"999"_s : u"001"_s);
+        EXPECT_EQ(storedField(EditRecord::FrameName), careful ? u"999"_s : u"001"_s);
         EXPECT_EQ(machine.dialogs.messages.size(), careful ? 1 : 0);
         editor.Image20_Click();
         EXPECT_EQ(corner().blue() > 240, careful);
         editor.Misgerett_Click(false);
-        open(lying, recordWith(EditRecord::FrameName, u"001"_s).replace(44, 2, u"aa"_s));
+        open(lying, recordWith(EditRecord::FrameName, u"001"_s, recordWith(EditRecord::FrameFolder, u"aa"_s)));
         EXPECT_EQ(shown().Misgerett.checked, careful) << "ticked for another picture";
         EXPECT_EQ(corner().green() > 240, careful);
         editor.Misgerett_Click(true);
@@ -84,7 +85,7 @@ TEST_F(TheEditor, carefullyRaisesTheZoomOfATurnedPictureToWhatCovers) {
         for (const bool careful : {false, true}) {
             SCOPED_TRACE(what);
             state.Careful = careful;
-            open(lying, recordWith(EditRecord::PanX, QString::number(panX)).replace(22, 4, u"150 "_s));
+            open(lying, recordWith(EditRecord::PanX, QString::number(panX), recordWith(EditRecord::PanY, u"150"_s)));
             for (const QChar key : QString::fromLatin1(keys))
                 press(key);
             EXPECT_EQ(field(EditRecord::ZoomPercent), QLatin1String(careful ? guarded : builtIn));

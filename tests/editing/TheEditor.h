@@ -62,11 +62,16 @@ protected:
         stored.clear();
         return editor;
     }
-    static QString recordWith(EditRecord::Column column, const QString& value) {
-        return EditRecord::newPicture().replace(column.position - 1, column.width, LeftField(value, column.width));
+    static QString recordWith(EditRecord::Column column, const QString& value,
+                              QString record = EditRecord::newPicture()) {
+        return record.replace(column.position - 1, column.width, LeftField(value, column.width));
     }
     QString field(EditRecord::Column column) const {
         return state.edit.EditState.mid(column.position - 1, column.width);
+    }
+    // Of the record that was stored last.
+    QString storedField(EditRecord::Column column) const {
+        return stored.value(stored.size() - 1).mid(column.position - 1, column.width);
     }
     const tFrmNewControls& shown() { return page().controls(); }
     const QImage& paper() { return shown().PicPic.image(); }

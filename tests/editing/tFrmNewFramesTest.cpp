@@ -13,7 +13,7 @@ TEST_F(TheEditor, putsTheBordersFrameOnAPictureThatHasNone) {
     EXPECT_GT(corner().green(), 240);
     editor.Image28_Click();
     EXPECT_GT(corner().red(), 240);
-    EXPECT_EQ(stored.last().mid(32, 6), u"999W00"_s);
+    EXPECT_EQ(storedField(EditRecord::FrameName) + storedField(EditRecord::LineFrameCode), u"999W00"_s);
 }
 
 TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
@@ -32,16 +32,16 @@ TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
     EXPECT_FALSE(editor.framePicture(1).isNull());
 
     editor.Image20_Click();
-    EXPECT_EQ(stored.last().mid(32, 3), u"001"_s);
+    EXPECT_EQ(storedField(EditRecord::FrameName), u"001"_s);
     editor.Image20_Click();
     editor.Image20_Click();
     EXPECT_EQ(shown().Label6.text, u"2  / "_s);
     EXPECT_EQ(editor.frameOnPicture(), 1);
-    EXPECT_EQ(stored.last().mid(32, 3), u"002"_s);
+    EXPECT_EQ(storedField(EditRecord::FrameName), u"002"_s);
     EXPECT_GT(corner().blue(), 240);
     editor.Image21_Click();
     editor.Image21_Click();
-    EXPECT_EQ(stored.last().mid(32, 3), u"001"_s);
+    EXPECT_EQ(storedField(EditRecord::FrameName), u"001"_s);
 
     // Another category is looked at; the picture's frame stays until one is taken.
     const QString before = state.edit.EditState;
@@ -52,8 +52,8 @@ TEST_F(TheEditor, walksTheFramesOfACategoryWithoutTurningRound) {
     editor.Misgerett_Click(false);
     editor.Image22_Click();
     EXPECT_TRUE(shown().Misgerett.checked);
-    EXPECT_EQ(stored.last().mid(32, 3), u"007"_s);
-    EXPECT_EQ(stored.last().mid(44, 10), u"bb        "_s);
+    EXPECT_EQ(storedField(EditRecord::FrameName), u"007"_s);
+    EXPECT_EQ(storedField(EditRecord::FrameFolder), u"bb        "_s);
     EXPECT_GT(corner().green(), 240);
 }
 
@@ -71,19 +71,19 @@ TEST_F(TheEditor, recordsLineFramesAndPaintsThemNowhere) {
     tFrmNew& editor = open(lying);
     const QImage before = paper();
     editor.Command9_Click();
-    EXPECT_EQ(stored.last().mid(35, 3), u"W01"_s);
+    EXPECT_EQ(storedField(EditRecord::LineFrameCode), u"W01"_s);
     editor.pic4Msgrt_MouseMove({40, 70});
     editor.pic4Msgrt_MouseMove({40, 130}); // below the cells
     EXPECT_EQ(shown().Label4.text, u"6"_s);
     EXPECT_EQ(shown().palette.marker(), QRect(33, 66, 33, 33));
     editor.PicInMsgrt_Click();
     editor.Image28_Click();
-    EXPECT_EQ(stored.last().mid(35, 3), u"Y00"_s);
+    EXPECT_EQ(storedField(EditRecord::LineFrameCode), u"Y00"_s);
     editor.Command18_Click(); // the first stays and is taken again
-    EXPECT_EQ(stored.last().mid(35, 3), u"Y01"_s);
+    EXPECT_EQ(storedField(EditRecord::LineFrameCode), u"Y01"_s);
     EXPECT_EQ(shown().Combo5.text, u"1"_s);
     editor.Combo5_Click(3);
-    EXPECT_EQ(stored.last().mid(35, 3), u"Y06"_s);
+    EXPECT_EQ(storedField(EditRecord::LineFrameCode), u"Y06"_s);
     EXPECT_EQ(paper(), before);
 }
 

@@ -22,7 +22,7 @@ TEST_F(TheEditor, givesANewPictureThePlaceOfThePapersCentreAndStoresIt) {
 
     // 780 is a position, 781 is none.
     for (const auto& [pan, expected] : {std::pair(780, 780), std::pair(781, 225)}) {
-        open(lying, recordWith(EditRecord::PanX, QString::number(pan)).replace(22, 4, u"20  "_s));
+        open(lying, recordWith(EditRecord::PanX, QString::number(pan), recordWith(EditRecord::PanY, u"20"_s)));
         EXPECT_EQ(state.edit.PanX, expected);
         EXPECT_EQ(state.edit.PanY, expected == 780 ? 20 : 150);
     }
@@ -122,7 +122,8 @@ TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
     EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
     editor.PicPic_MouseUp();
     editor.PicPic_MouseMove({300, 300});
-    EXPECT_EQ(stored.last().mid(18, 8), u"227 150 "_s); // 226.6, and 149.5 to the even one
+    EXPECT_EQ(storedField(EditRecord::PanX) + storedField(EditRecord::PanY),
+              u"227 150 "_s); // 226.6, and 149.5 to the even one
     ASSERT_EQ(stored.size(), 1);
 
     editor.Command8_Click();
@@ -175,7 +176,7 @@ TEST_F(TheEditor, greysThePictureOnceWhateverTonesFollow) {
         (editor.*press)();
         EXPECT_TRUE(near(middle(), colour)) << qPrintable(colour.name());
     }
-    const QString sepia = recordWith(EditRecord::ToneFlag, u"1"_s).replace(0, 4, u"1.3 "_s);
+    const QString sepia = recordWith(EditRecord::ToneFlag, u"1"_s, recordWith(EditRecord::GainR, u"1.3"_s));
     open(lying, sepia);
     EXPECT_TRUE(near(middle(), QColor(99, 76, 76)));
     editor.Image4_Click();
@@ -189,7 +190,8 @@ TEST_F(TheEditor, undoesAllButFrameCaptionAndRedEyes) {
     const DrivePath copy = WorkspacePaths::corrected(state, lying);
     ASSERT_TRUE(Bitmap(400, 300, Qt::blue).image().save(toText(host(copy)), "BMP"));
     const QString before =
-        recordWith(EditRecord::RedMarker, u"RED"_s).replace(32, 3, u"017"_s).replace(126, 4, u"Dana"_s);
+        recordWith(EditRecord::RedMarker, u"RED"_s,
+                   recordWith(EditRecord::FrameName, u"017"_s, recordWith(EditRecord::TextBody, u"Dana"_s)));
     tFrmNew& editor = open(lying, before);
     EXPECT_GT(middle().blue(), 240);
     editor.Image4_Click();
@@ -266,9 +268,11 @@ TEST_F(TheEditor, beginsACaptionAndHandsItToTheKeyboard) {
     EXPECT_TRUE(chain.find<mikledet>()->controls().Check4.checked);
     state.edit.TextBody = u"Dana"_s;
     editor.Command11_Click();
-    EXPECT_EQ(stored.last().mid(54, 8), u"240 0 0 "_s);
-    EXPECT_EQ(stored.last().mid(74, 15), u"30 255255100100"_s);
-    EXPECT_EQ(stored.last().mid(126, 4), u"Dana"_s);
+    EXPECT_EQ(storedField(EditRecord::TextFontSize) + storedField(EditRecord::TextAlign), u"240 "_s);
+    EXPECT_EQ(storedField(EditRecord::TextBlue) + storedField(EditRecord::TextGreen) +
+                  storedField(EditRecord::TextRed) + storedField(EditRecord::TextX) + storedField(EditRecord::TextY),
+              u"30 255255100100"_s);
+    EXPECT_EQ(storedField(EditRecord::TextBody).trimmed(), u"Dana"_s);
     editor.CommandDone_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(chain.find(PageId::mikledet), nullptr);
@@ -308,7 +312,7 @@ TEST_F(TheEditor, keepsTheSmallViewInLogicalPixelsHoweverSharpTheScreen) {
 TEST_F(TheEditor, measuresLevelsOnRequestAndAtEachOpeningFromThenOn) {
     open(lying);
     page().Command6_Click();
-    EXPECT_EQ(stored.last().mid(41, 3), u"111"_s);
+    EXPECT_EQ(storedField(EditRecord::AutoMarker), u"111"_s);
     const QString measured = state.edit.EditState;
     auto& surfaces = chain.load<BigPics>();
     EXPECT_EQ(surfaces.controls().List1.count(), 61 * 46);
