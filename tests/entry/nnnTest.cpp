@@ -26,39 +26,6 @@ protected:
         }
         return page;
     }
-    void checkTheDetails() {
-        nnn& page = start();
-        state.MishloachHabaita = true;
-        page.Image1_Click(0);
-        const std::pair<const char*, std::function<void()>> missing[] = {
-            {"Text2", [&] { page.Text2_Change(u"Dana"_s); }}, {"Text4", [&] { page.Text4_Change(u"Haifa"_s); }}};
-        for (const auto& [box, fill] : missing) {
-            const int focused = page.focus().request;
-            page.Command12_Click();
-            EXPECT_EQ(page.focus().control, QLatin1String(box));
-            EXPECT_GT(page.focus().request, focused);
-            fill();
-        }
-        EXPECT_EQ(machine.dialogs.messages.size(), 2);
-        page.Text3_Change(u"052-7654321-12"_s);
-        page.Command12_Click();
-        EXPECT_EQ(page.step(), state.Careful ? nnn::Step::Details : nnn::Step::Options);
-        EXPECT_EQ(page.focus().control, state.Careful ? u"Text3"_s : u"Text4"_s);
-        machine.dialogs.answers = {true};
-        page.Command12_Click();
-        EXPECT_EQ(page.step(), nnn::Step::Options);
-        EXPECT_EQ(machine.files.fileExists(customerStore), !state.Careful);
-        // The page's end forgets them, unless the customer asked to be remembered.
-        page.Text3_Change(u"03-1"_s);
-        ASSERT_TRUE(machine.files.writeWhole(customerStore, "of an earlier customer").ok());
-        page.Option1_Click(0);
-        page.Option3_Click(1);
-        page.Image13_MouseDown(9);
-        page.Command6_Click();
-        page.Check1_Click(true);
-        page.Command3_Click();
-        EXPECT_FALSE(machine.files.fileExists(customerStore));
-    }
 };
 
 TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
@@ -193,7 +160,37 @@ TEST_F(nnnTest, ChecksTheDetailsBeforeTheOptions) {
         chain.unload(PageId::kyoskNew);
         deployment.Careful = careful;
         machine.dialogs.answers.clear();
-        checkTheDetails();
+        nnn& page = start();
+        state.MishloachHabaita = true;
+        page.Image1_Click(0);
+        const std::pair<const char*, std::function<void()>> missing[] = {
+            {"Text2", [&] { page.Text2_Change(u"Dana"_s); }}, {"Text4", [&] { page.Text4_Change(u"Haifa"_s); }}};
+        for (const auto& [box, fill] : missing) {
+            const int focused = page.focus().request;
+            page.Command12_Click();
+            EXPECT_EQ(page.focus().control, QLatin1String(box));
+            EXPECT_GT(page.focus().request, focused);
+            fill();
+        }
+        EXPECT_EQ(machine.dialogs.messages.size(), 2);
+        page.Text3_Change(u"052-7654321-12"_s);
+        page.Command12_Click();
+        EXPECT_EQ(page.step(), state.Careful ? nnn::Step::Details : nnn::Step::Options);
+        EXPECT_EQ(page.focus().control, state.Careful ? u"Text3"_s : u"Text4"_s);
+        machine.dialogs.answers = {true};
+        page.Command12_Click();
+        EXPECT_EQ(page.step(), nnn::Step::Options);
+        EXPECT_EQ(machine.files.fileExists(customerStore), !state.Careful);
+        // The page's end forgets them, unless the customer asked to be remembered.
+        page.Text3_Change(u"03-1"_s);
+        ASSERT_TRUE(machine.files.writeWhole(customerStore, "of an earlier customer").ok());
+        page.Option1_Click(0);
+        page.Option3_Click(1);
+        page.Image13_MouseDown(9);
+        page.Command6_Click();
+        page.Check1_Click(true);
+        page.Command3_Click();
+        EXPECT_FALSE(machine.files.fileExists(customerStore));
     }
 }
 
@@ -258,7 +255,7 @@ TEST_F(nnnTest, TheOtherTilesDoWhatTheySay) {
     EXPECT_TRUE(chain.hasEnded());
 }
 
-TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndKeepsWhatMayNotHaveArrived) {
+TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndCarefullyKeepsWhatMayNotHaveArrived) {
     using Phase = OrderState::Phase;
     using Way = OrderState::Way;
     const DrivePath orders = u"C:\\2000lumora\\!!000"_path;
@@ -278,7 +275,7 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndKeepsWhatMayNotHaveArrived) {
             const OrderFolder folder(folderOf(g.number));
             std::filesystem::remove_all(host(folder.path()));
             makeFolder(folder.path());
-            for (const QString& name : {u"!1.jpp"_s, u"a.jpp"_s, folder.name() + u".txt"_s})
+            for (const QString& name : {u"!1.jpp"_s, u"a.jpp"_s, u"b.JPP"_s, u"c.prk"_s, folder.name() + u".txt"_s})
                 ASSERT_TRUE(machine.files.writeWhole(folder.filePath(name), "x"));
             OrderState order;
             order.phase = g.phase.value_or(Phase::Prepared);
@@ -321,14 +318,16 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndKeepsWhatMayNotHaveArrived) {
                   QStringList({"ניקיון ההיסטוריה הושלם\nמדובר על קבצים הקשורים לתוכנה זו בלבד"}));
         EXPECT_EQ(left(), c.left) << (&c - cases);
         EXPECT_TRUE(machine.dialogs.answers.isEmpty());
-        EXPECT_TRUE(machine.files.fileExists(folderOf(u"101"_s) / u"!1.jpp"));
+        EXPECT_EQ(machine.files.names(folderOf(u"102"_s), u"*"_s),
+                  QStringList({"!1.jpp", "2026_11_20_KUP_1234^102.txt", "b.JPP", "c.prk"}))
+            << "the print files go but for the first";
     }
     chain.unload(PageId::nnn);
     deployment.MinuyPaar = 2;
     EXPECT_FALSE(start().controls().Command14.visible) << "a lab without quick orders";
 }
 
-TEST_F(nnnTest, OpensTheFinishedOrdersAlsoWhereTheDiskIsFull) {
+TEST_F(nnnTest, OpensTheFinishedOrdersAlsoWhereManaCannotBeWritten) {
     makeFolder(u"C:\\2000lumora\\!!000\\mana.txt"_s); // can't be written
     start().Image1_Click(4);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);

@@ -83,7 +83,7 @@ TEST(OrderReport, KnowsThePaperKindsOfBothLanguages) {
     EXPECT_EQ(PaperKindLetter(u"***"_s), QString());
 }
 
-TEST(ReadOrderDetails, TakesNineFieldsAndLeavesWhatTheLogLacks) {
+TEST(ReadOrderDetails, TakesTheFieldsOfTheLogAndLeavesTheOthers) {
     TestPlatform test;
     const DrivePath path = u"C:\\log.txt"_path;
     (void)test.files.writeWhole(path, "\"00\",\"00\"\r\n\"Shemot.n1\",\"a, \"b\" c\"\r\n\"Shemot.TotalPics\",13\r\n"

@@ -142,21 +142,7 @@ TEST(ForwardCalls, ReachTheRunOfTheSameFolderAsLongAsItLives) {
     EXPECT_FALSE(CallForward(toHostPath(folder.path())));
 }
 
-TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAsLongAsBothAreThere) {
-    const QTemporaryDir folder;
-    const QTemporaryDir elsewhere;
-    const Instances first(folder.path().toStdString());
-    const Instances stranger(elsewhere.path().toStdString());
-    EXPECT_FALSE(first.another());
-    std::optional<Instances> second(std::in_place, folder.path().toStdString());
-    EXPECT_TRUE(first.another());
-    EXPECT_TRUE(second->another());
-    EXPECT_FALSE(stranger.another());
-    second.reset();
-    EXPECT_FALSE(first.another());
-}
-
-TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
+TEST(InstancesTest, RunsOverOneFolderKnowOfEachOtherAndOneThatWantsItAloneGetsItOrIsRefused) {
     using Lock = Instances::Lock;
     for (const auto& [first, second, refused] : {std::tuple{Lock::Exclusive, Lock::Exclusive, true},
                                                  {Lock::Exclusive, Lock::Shared, true},
@@ -166,8 +152,15 @@ TEST(InstancesTest, ARunThatWantsItsFolderAloneGetsItOrIsRefused) {
         const QTemporaryDir elsewhere;
         std::optional<Instances> one(std::in_place, folder.path().toStdString(), first);
         EXPECT_FALSE(one->refused() || one->fault());
-        EXPECT_EQ(Instances(folder.path().toStdString(), second).refused(), refused);
-        EXPECT_FALSE(Instances(elsewhere.path().toStdString(), second).refused()) << "another data folder";
+        EXPECT_FALSE(one->another());
+        {
+            const Instances two(folder.path().toStdString(), second);
+            EXPECT_EQ(two.refused(), refused);
+            EXPECT_EQ(one->another() && two.another(), !refused);
+            const Instances stranger(elsewhere.path().toStdString(), second);
+            EXPECT_FALSE(stranger.refused() || stranger.another()) << "another data folder";
+        }
+        EXPECT_FALSE(one->another()) << "the second has ended";
         one.reset();
         EXPECT_FALSE(Instances(folder.path().toStdString(), second).refused()) << "the first has ended";
     }

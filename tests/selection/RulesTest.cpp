@@ -175,7 +175,7 @@ TEST(AChoice, ofTheWholeFolderKeepsCopiesAndKnowsTheEnglishWordsCarefully) {
 
 // n next, p previous, c the chosen alone, a one picture alone; then the first picture and the number of pictures of the
 // page.
-TEST(AChoice, showsThePagesThatWereSeen) {
+TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
     const struct {
         bool careful;
         const char* presses;

@@ -91,20 +91,5 @@ TEST_F(WorkspaceTest, CleansTheScratchFoldersAndNothingElse) {
         EXPECT_TRUE(machine.files.fileExists(DrivePath(path))) << path.toStdString();
 }
 
-TEST_F(WorkspaceTest, CleansTheHistoryButForTheFirstFileOfEachOrder) {
-    make();
-    const DrivePath order = u"C:\\2000lumora\\!!000\\2026_11_21_KUP_1234^105"_path;
-    const DrivePath other = u"C:\\2000lumora\\!!000\\2026_11_22_KUP_1234^106"_path;
-    makeFolder(order);
-    makeFolder(other);
-    for (const char* name : {"!105_1234.jpp", "1 1015.jpp", "1 1318.JPP", "order.txt", "part.prk"})
-        write(order / QString::fromLatin1(name), "x");
-    write(other / u"only.jpp", "x");
-    workspace.CleanHistory();
-    EXPECT_EQ(machine.files.names(order, u"*"_s),
-              QStringList({"!105_1234.jpp", "1 1318.JPP", "order.txt", "part.prk"}));
-    EXPECT_EQ(machine.files.names(other, u"*"_s), QStringList({"only.jpp"}));
-}
-
 } // namespace
 } // namespace lumora

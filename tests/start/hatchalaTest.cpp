@@ -99,7 +99,7 @@ TEST_F(hatchalaTest, ThePressOnStartHandsOverOnce) {
     EXPECT_FALSE(page.timers().Timer2.running() || page.timers().Timer5.running());
 }
 
-TEST_F(hatchalaTest, TheCountdownStartsByItself) {
+TEST_F(hatchalaTest, TheOrderBeginsWhenTheCountdownEnds) {
     hatchala& page = start();
     for (int second = 0; second < 5; ++second)
         page.Timer4_Tick();
