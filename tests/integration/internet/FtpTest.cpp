@@ -306,7 +306,9 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         {"closing reply bad", "STOR 1 closing('451 Disk full')", Failure::Kind::Refused, 5'000},
         {"closing reply never comes", "STOR 1 hang_before_the_end", Failure::Kind::TimedOut, 5'000},
         {"cut with a good reply", "STOR 1 passed(cut=300_000, reset_server=False)", Failure::Kind::Disconnected,
-         3'000'000},
+         9'000'000},
+        {"cut behind the last bytes, with a good reply", "STOR 1 passed(cut=100, reset_server=False)",
+         Failure::Kind::Disconnected, 5'000},
         {"closing reply lost", "STOR 1 closing('')", Failure::Kind::Disconnected, 5'000},
         {"put refused", "STOR 1 reply('552 Quota exceeded')", Failure::Kind::Refused, 5'000},
         {"too many", "STOR 1 reply('421 Too many')", Failure::Kind::Refused, 5'000},
@@ -344,7 +346,7 @@ TEST_F(FtpTest, ReadsRepliesOfManyLinesThatComeLate) {
     EXPECT_EQ(ftp->list(u"*.*"_s)->entries.size(), 1U);
     EXPECT_EQ(ftp->currentDirectory().value(), u"/zalamim234"_s);
     EXPECT_FALSE(ftp->remove(u"none"_s));
-    EXPECT_EQ(ftp->lastResponse().count(u'\n'), 3);
+    EXPECT_EQ(ftp->lastResponse().count(u'\n'), 4);
 }
 
 TEST_F(FtpTest, TellsARefusedListingFromAnEmptyFolderAndEncryptionFromAWrongPassword) {
