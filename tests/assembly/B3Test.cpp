@@ -49,7 +49,7 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
     EXPECT_EQ(*readPictureSize(host(jobFolder / u"12~תמונה 01.bmp")), (PictureSize{300, 450}));
     EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path)) << "goes at the end of each step";
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
+    EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
@@ -118,7 +118,7 @@ TEST_F(PreparingAnEditedOrder, neverPrintsOnePictureAsAnother) {
         << "failed pictures leave holes in the numbers";
     EXPECT_EQ(front(), PageId::FtpFrm) << "a failed picture never stops an order";
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << "the order's own files are all written";
-    EXPECT_TRUE(machine.files.read(logPath())->contains("\"Failed  \",\"C:\\pics\\vanished3.jpg\"\r\n"));
+    EXPECT_TRUE(read(logPath()).contains("\"Failed  \",\"C:\\pics\\vanished3.jpg\"\r\n"));
     EXPECT_EQ(state.shemot.TotalPics, 8) << "a name too short for a picture is skipped in silence, and counted";
 
     chain.unload(PageId::FtpFrm);
@@ -149,7 +149,7 @@ TEST_F(PreparingAnEditedOrder, carefullyPrintsAPictureThatWasNeverOpenedAsTheEdi
         state.shemot.Bord = QString::fromLatin1(c.border);
         const QString none = *c.record == 'n' ? EditRecord::newPicture() : QString(200, u' ');
         EXPECT_EQ(prepare({edited(lying, none), edited(upright, none), edited(damaged, none)}), QStringList(damaged));
-        const QString log = QString::fromLatin1(*machine.files.read(logPath()));
+        const QString log = QString::fromLatin1(read(logPath()));
         const qsizetype line = log.indexOf(u"\"Shoora\",\"1 1015GNB"_s) + 19;
         const auto shown = [&](qsizetype at) { return log.mid(at + 18, 8) + log.mid(at + 32, 3); };
         EXPECT_EQ(shown(line), QLatin1String(c.lying));

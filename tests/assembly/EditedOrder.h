@@ -73,8 +73,9 @@ protected:
     // The picture inside the print file of that place in the list.
     QImage print(int index) const {
         for (const QString& name : printFiles(state.MisparHazmana)) {
-            if (name.mid(9, 4).toInt() == index)
-                return QImage::fromData(unpacked(name, state.MisparHazmana)->picture, "JPEG");
+            const Result<PrintFileContent> content = unpacked(name, state.MisparHazmana);
+            if (content && name.mid(9, 4).toInt() == index)
+                return QImage::fromData(content->picture, "JPEG");
         }
         return {};
     }

@@ -21,10 +21,10 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(print->tail, "1 1 03-1234567Dana Levi 13 1051234      ");
     EXPECT_EQ(QImage::fromData(print->picture).size(), QSize(1200, 1600));
     EXPECT_EQ(jpegQuality(print->picture), 90);
-    EXPECT_EQ(jpegQuality(*machine.files.read(folder() / u"!105_1234.jpp")), 90);
+    EXPECT_EQ(jpegQuality(read(folder() / u"!105_1234.jpp")), 90);
     EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{500, 480}));
 
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
+    EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the number in memory stays this order's";
     EXPECT_EQ(state.shemot.TotalPics, 13);
     EXPECT_EQ(state.transfer.OrderFolder, folder());
@@ -60,7 +60,7 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
                   QStringList({u"1 1015GNB0000_016669727374.jpp"_s, u"1 1015GNB0002_017468697264.jpp"_s}))
             << "the failed picture leaves a hole in the numbers";
         EXPECT_NE(unpacked(printFiles(number)[0], number)->picture, unpacked(printFiles(number)[1], number)->picture);
-        const QByteArray log = *machine.files.read(logPath(number));
+        const QByteArray log = read(logPath(number));
         EXPECT_TRUE(log.contains("\"-----------Total Failed\",\"1-----------\"\r\n"));
         EXPECT_TRUE(log.contains("\"More Comp = \"," + QByteArray::number(deep) + "\r\n"));
         EXPECT_EQ(front(), PageId::FtpFrm) << "one failed picture never stops an order";
@@ -133,7 +133,7 @@ TEST_F(PreparingAPlainOrder, takesNoSecondPressAndNoRemovalWhileItPrepares) {
     page.Command6_Click();
     EXPECT_EQ(printFiles().size(), 2);
     EXPECT_FALSE(machine.files.folderExists(folder(u"106"_s)));
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
+    EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
 }
 
 TEST_F(PreparingAPlainOrder, endsTheProgramAtOnceWhenTheCustomerLeaves) {
@@ -167,16 +167,16 @@ TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinished
             << qPrintable(left.text());
 
     // The counter is lost, and the number comes again.
-    const QByteArray finished = *machine.files.read(logPath(u"107"_s));
+    const QByteArray finished = read(logPath(u"107"_s));
     chain.unload(PageId::FtpFrm);
     state.MisparHazmana = u"107"_s;
     openWith({picture, picture}).Command6_Click();
     EXPECT_EQ(state.MisparHazmana, u"108"_s);
     EXPECT_EQ(printFiles(u"107"_s).size(), 1);
-    EXPECT_EQ(*machine.files.read(logPath(u"107"_s)), finished);
+    EXPECT_EQ(read(logPath(u"107"_s)), finished);
     EXPECT_EQ(printFiles(u"108"_s).size(), 2);
     EXPECT_EQ(checkOrderFolder(host(folder(u"108"_s)), {56, 30})->faults, QStringList());
-    EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "109\r\n");
+    EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "109\r\n");
 }
 
 TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePictures) {
@@ -306,7 +306,7 @@ TEST_F(PreparingAnAlbum, holdsTogetherForWhoReadsTheFolder) {
         const QString number = marked == 1 ? u"105P"_s : u"105"_s;
         openWith({albumLine(givePicture(u"one.jpg"_s), u"2 "_s), albumLine(giveFile(u"bad.jpg"_s, "no picture"))})
             .Command6_Click();
-        EXPECT_TRUE(machine.files.read(logPath(number))->contains("KUP_1234^105\"")) << "never with the P";
+        EXPECT_TRUE(read(logPath(number)).contains("KUP_1234^105\"")) << "never with the P";
         chain.unload(PageId::FtpFrm);
         const Result<OrderFindings> report = checkOrderFolder(host(folder(number)), PrintFileShape::of(state.profile));
         ASSERT_TRUE(report);

@@ -48,7 +48,7 @@ protected:
     QMap<QString, QByteArray> content() const {
         QMap<QString, QByteArray> bytes;
         for (const QString& name : machine.files.names(folder(), u"*"_s))
-            bytes[name] = *machine.files.read(folder() / name);
+            bytes[name] = read(folder() / name);
         return bytes;
     }
     OrderState stored() const { return *ReadOrderState(machine.files, OrderFolder(folder())); }
@@ -78,7 +78,7 @@ TEST_F(GoingOnWithAnOrder, MakesTheSameOrderAndNoPrintTwice) {
         EXPECT_EQ(before.gone, 0);
         EXPECT_EQ(content(), undisturbed) << edits;
         EXPECT_EQ(stored().phase, OrderState::Phase::Prepared);
-        EXPECT_EQ(*machine.files.read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
+        EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
         EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
         chain.unload(PageId::FtpFrm);
         fs::remove_all(host(folder()));
@@ -99,7 +99,7 @@ TEST_F(GoingOnWithAnOrder, MakesAllPrintsAnewInAnotherShapeAndCountsAPictureThat
     for (const QString& name : printFiles())
         EXPECT_TRUE(unpacked(name)) << name.toStdString();
     OrderLog log;
-    log.read(*machine.files.read(logPath()));
+    log.read(read(logPath()));
     EXPECT_EQ(log.failed, QStringList(paths[3]));
     EXPECT_EQ(state.transfer.leftOut.value(0).picture, u"C:\\x.png"_path) << "it stands in no line and not in the log";
 }

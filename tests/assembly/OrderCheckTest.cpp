@@ -21,7 +21,7 @@ protected:
     // The faults after a change to a file of the folder; the file is put back.
     QStringList faultsWith(const QString& name, const std::function<void(QByteArray&)>& change) const {
         const DrivePath path = folder() / name;
-        const QByteArray before = *machine.files.read(path);
+        const QByteArray before = read(path);
         QByteArray changed = before;
         change(changed);
         EXPECT_TRUE(machine.files.writeWhole(path, changed));
@@ -39,7 +39,7 @@ TEST_F(CheckingAnOrder, namesTheFileAtFault) {
     ASSERT_TRUE(report && report->faults.isEmpty());
     EXPECT_EQ(QList({report->items, report->prints, report->failed, report->copies}), QList({4, 2, 1, 15}));
     // A print file whose picture is cut short still falls into its pieces.
-    const QByteArray tail = readPrintFile(*machine.files.read(folder() / two), {56, 30})->tail;
+    const QByteArray tail = readPrintFile(read(folder() / two), {56, 30})->tail;
     QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);
     picture.chop(picture.size() / 2);
     const QString sheet = u"!105_1234.jpp"_s;

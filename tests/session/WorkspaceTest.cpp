@@ -27,14 +27,14 @@ TEST_F(WorkspaceTest, MakesTheTreeOfAFreshDriveAndStartsAtNumberHundred) {
     EXPECT_EQ(machine.files.folders(WorkspacePaths::zmany(state)), QStringList({"job_folder", "ktanim", "tempred"}));
     ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"100");
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\!!000\\mana.txt"_path), "1\r\n");
+    EXPECT_EQ(read(u"C:\\2000lumora\\!!000\\mana.txt"_path), "1\r\n");
     ASSERT_TRUE(workspace.writeCounter().ok());
-    EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "101\r\n");
+    EXPECT_EQ(read(WorkspacePaths::counter(state)), "101\r\n");
     ASSERT_TRUE(workspace.CleanWorkspace(state.MisparHazmana).ok());
     EXPECT_EQ(state.MisparHazmana, u"101");
     write(WorkspacePaths::counter(state), "108\r\n");
     ASSERT_TRUE(workspace.writeCounter().ok());
-    EXPECT_EQ(*machine.files.read(WorkspacePaths::counter(state)), "108\r\n") << "the counter never goes back";
+    EXPECT_EQ(read(WorkspacePaths::counter(state)), "108\r\n") << "the counter never goes back";
 }
 
 TEST_F(WorkspaceTest, NamesTheFolderThatCannotBeMade) {
