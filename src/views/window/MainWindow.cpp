@@ -107,6 +107,9 @@ void MainWindow::bringToFront(PageView* view) {
     }
     if (Overlay* box = frontOverlay(*this)) {
         box->raise();
+        // A panel that opened while its page was made has not taken the keyboard.
+        if (!box->isAncestorOf(QApplication::focusWidget()))
+            (box->focusWidget() ? box->focusWidget() : box)->setFocus(Qt::OtherFocusReason);
         return;
     }
     QWidget* first = uncovered == view && m_focusBelow ? m_focusBelow.data() : view->firstFocus();
