@@ -90,7 +90,7 @@ TEST_P(EditorLook, OpensTheOperatorsToolsWhereTheLabSaysSo) {
 }
 
 // With the events of a mouse, as a scenario makes them.
-TEST(EditorByMouse, HoldsDragsAndTaps) {
+TEST(EditorByMouse, ZoomsWhileAButtonIsHeldAndMovesWhatIsDragged) {
     Walk walk(Screen{{1024, 768}, true});
     walk.toEditor();
     auto& page = walk.page<tFrmNew>(PageId::tFrmNew);

@@ -14,7 +14,7 @@
 
 namespace lumora {
 
-TEST_P(PageLook, FromTheStartToTheTerms) {
+TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {
     Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
     go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! Text2=Dana Text3=+1-212-555-01234"_s);
@@ -23,7 +23,7 @@ TEST_P(PageLook, FromTheStartToTheTerms) {
     go(walk, toBorder + u":08-border "_s + toTerms + u":09-terms Command3 :09-terms-not-agreed !"_s);
 }
 
-TEST_P(PageLook, FromThePicturesToTheSending) {
+TEST_P(PageLook, HasNoFaultFromThePicturesToTheSending) {
     Walk walk(GetParam(), u"[Switches]\nCoupon = no\n[Guards]\nCareful = yes\n"_s);
     go(walk, toDetails + toOptions + toBorder + toTerms + toPictures + u":10-no-pictures"_s);
     lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
@@ -35,7 +35,7 @@ TEST_P(PageLook, FromThePicturesToTheSending) {
     look(walk, u"17-countdown"_s);
 }
 
-TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
+TEST_P(PageLook, HasNoFaultWithAWholeFolderAndTheShopsOfACoupon) {
     Walk walk(
         GetParam(),
         u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
@@ -55,7 +55,7 @@ TEST_P(PageLook, TheWholeFolderAndTheShopsOfACoupon) {
              "showCoarse :24-coarse"_s);
 }
 
-TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
+TEST_P(PageLook, HasNoFaultWhileAnEditedOrderIsPrepared) {
     Walk walk(GetParam());
     SessionState& state = walk.program().state();
     state.Optint = OrderKind::EditedPrint;
@@ -76,7 +76,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     state.handOver.basket = state.handOver.lines;
     walk.program().chain().show(PageId::B3);
     auto& page = walk.page<B3>(PageId::B3);
-    page.Command5_Click();
+    walk.press(u"B3"_s, u"Command5"_s);
     ASSERT_TRUE(files.removeFile(orders).ok());
     go(walk, u"! :25-to-prepare"_s);
     // In the middle of the work: the timer ticks while the page lets the screen update.
@@ -90,7 +90,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
         look(walk, u"26-preparing-edited"_s);
     });
     middle.start(0);
-    page.Command5_Click();
+    walk.press(u"B3"_s, u"Command5"_s);
     EXPECT_TRUE(looked);
     walk.waitFor(u"FtpFrm"_s);
     look(walk, u"27-left-out"_s);
@@ -98,7 +98,7 @@ TEST_P(PageLook, ThePreparationOfAnEditedOrder) {
     look(walk, u"27-left-out-told"_s);
 }
 
-TEST_P(PageLook, TheAlbumFromThePhotographerToTheClosingPanel) {
+TEST_P(PageLook, HasNoFaultFromThePhotographerOfAnAlbumToTheClosingPanel) {
     Walk walk(GetParam(), u"[Switches]\nCoupon = no\nDeepCompression = always\n"_s);
     // The panels slide to their places before they are looked at.
     const auto goOn = [&](const QString& route) {

@@ -5,9 +5,12 @@
 #include "views/kit/HoldButton.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
+#include "views/window/ScreenDialogs.h"
 
 #include <QApplication>
+#include <QKeySequence>
 #include <QTest>
+#include <QTimer>
 #include <QVBoxLayout>
 
 #include <gtest/gtest.h>
@@ -47,6 +50,21 @@ TEST(Panel, LeavesThePageBelowInSightAndUsableWhereItIsNotCovered) {
     ASSERT_TRUE(window.viewBelow());
     EXPECT_EQ(window.frontView()->width(), 1920);
     walk.press(start, u"Check1"_s);
+}
+
+TEST(QuestionBox, AnswersWhatWasPressed) {
+    Walk walk({1024, 768});
+    walk.activate();
+    for (const auto& [pressed, yes] :
+         {std::pair("messageYes", true), {"messageNo", false}, {"Return", true}, {"Esc", false}}) {
+        QTimer::singleShot(50, &walk.program().window(), [&walk, name = QString::fromLatin1(pressed)] {
+            if (name.startsWith(u"message"_s))
+                QTest::mouseClick(&walk.control(name), Qt::LeftButton);
+            else
+                walk.key(QKeySequence(name)[0].key());
+        });
+        EXPECT_EQ(walk.program().dialogs().ask(u"Throw the order away?"_s), yes) << pressed;
+    }
 }
 
 TEST(HeldButton, TellsTheTapFromTheLossAndLetsGoOnce) {

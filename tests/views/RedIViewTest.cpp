@@ -36,8 +36,8 @@ Bitmap flashPhotograph() {
 
 class RedEyeView : public PageLook {
 protected:
-    RedEyeView()
-        : walk(GetParam()) {
+    explicit RedEyeView(const QString& labSettings = {})
+        : walk(GetParam(), labSettings) {
         const DrivePath path = walk.pictureFolder() / u"IMG_0001.jpg";
         EXPECT_TRUE(saveJpeg(flashPhotograph(), *walk.program().platform().files.drives().toHost(path), 95).ok());
         walk.program().state().edit.PicturePath = path;
@@ -59,6 +59,12 @@ protected:
 };
 
 class RedEyeHands : public RedEyeView {};
+
+class RedEyeOperator : public RedEyeView {
+protected:
+    RedEyeOperator()
+        : RedEyeView(u"[Operator]\nEditor = yes\n"_s) {}
+};
 
 } // namespace
 
@@ -141,7 +147,9 @@ TEST_P(RedEyeHands, FollowsADragTheKeysAndAHeldArrow) {
     EXPECT_FALSE(page().holds());
 
     EXPECT_FALSE(walk.pressable(u"RedI"_s, u"HScroll1"_s)) << "not for customers";
-    walk.program().state().DegelEdit = true;
+}
+
+TEST_P(RedEyeOperator, SetsTheLevelByTheKeyboard) {
     pressOverview(eye);
     go(u"Command13 Command6 Image2"_s);
     EXPECT_GT(page().picture().RedPeakValue, 200);
@@ -157,5 +165,7 @@ TEST_P(RedEyeHands, FollowsADragTheKeysAndAHeldArrow) {
 INSTANTIATE_TEST_SUITE_P(Screens, RedEyeView, PageLook::screens(), PageLook::nameOf);
 
 INSTANTIATE_TEST_SUITE_P(Screens, RedEyeHands, ::testing::Values(Screen{{1024, 768}, false}));
+
+INSTANTIATE_TEST_SUITE_P(Screens, RedEyeOperator, ::testing::Values(Screen{{1024, 768}, false}));
 
 } // namespace lumora

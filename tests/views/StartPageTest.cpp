@@ -48,24 +48,25 @@ class StartLook : public PageLook {};
 
 } // namespace
 
-TEST_P(StartLook, TheStartPageInEachOfItsStates) {
-    Walk walk(GetParam(), u"[Switches]\nDeliveryQuestion = yes\n"_s);
-    hatchala& page = startPage(walk);
-    for (const QString& name : {u"Image11"_s, u"Image6"_s}) {
-        mouseGoes(walk, name, true);
-        look(walk, u"01-start-help-"_s + name);
-        mouseGoes(walk, name, false);
-    }
+TEST_P(StartLook, HasNoFaultInAnyOfItsStates) {
+    Walk walk(Screen{GetParam().size, false}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
     // An advertising picture that the lab's installation has placed.
     const HostPath folder =
         *walk.program().platform().files.drives().toHost(walk.program().state().DiskRoot / u"lumora\\zmany");
     std::filesystem::create_directories(folder);
     ASSERT_TRUE(saveJpeg(Bitmap(400, 300, Qt::cyan), folder / "ad01.jpg", 90).ok());
-    page.Timer2_Tick();
-    page.Timer4_Tick();
+    walk.program().chain().unload(PageId::hatchala);
+    walk.settle();
+    hatchala& page = startPage(walk);
+    if (GetParam().english)
+        walk.press(u"hatchala"_s, u"Check1"_s);
+    for (const QString& name : {u"Image11"_s, u"Image6"_s}) {
+        mouseGoes(walk, name, true);
+        look(walk, u"01-start-help-"_s + name);
+        mouseGoes(walk, name, false);
+    }
     look(walk, u"01-start-advert"_s);
-    while (page.motion().Picture4Width() > 120)
-        page.Timer2_Tick();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return page.motion().Picture4Width() < StartMotion::pictureWidth / 2; }, 60000));
     look(walk, u"01-start-advert-closing"_s);
 
     // The panel of the shops unfolds, closes in two ways and answers.
@@ -87,7 +88,7 @@ TEST_P(StartLook, TheStartPageInEachOfItsStates) {
     EXPECT_EQ(walk.program().state().KodMishloach, u"OSK");
 }
 
-TEST_P(StartLook, TheOfferOfAnOrderThatWasNotFinished) {
+TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
     Walk walk(GetParam());
     SessionState& state = walk.program().state();
     for (const QString& number : {u"105"_s, u"106"_s}) {
