@@ -20,7 +20,7 @@ struct UploadFormRig : SendingRig {
         profile.HttpDoneUrl = u"http://192.0.2.11/aaasssppp/p.asp"_s;
         write(log(), "the order");
         write(sheet(), QByteArray(900, 's'));
-        write(third(), {});
+        write(third(), QByteArray("\xFF\xD8 third").repeated(50));
         registerPage<UploadForm>();
     }
 
