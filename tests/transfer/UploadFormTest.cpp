@@ -551,6 +551,7 @@ TEST(HttpSender, BelievesAListOnlyOfTheOrdersFolderAndWithATotal) {
     RecordedSending told;
     HttpSender sender(rig.state, rig.test.platform, told);
     sender.BuildOrderFileList();
+    lab.uploads[UploadFormRig::name()]; // the folder stands
     lab.listInstead = UploadFormRig::name().toLatin1() + "~~021015GNB0000_03AABB.jpp~~!105_1234.jpg";
     EXPECT_EQ(sender.CheckOrderOnServer(0), ServerVerdict::NotVerified);
     EXPECT_EQ(told.number(SendingMoment::Missing), 3) << "what is named counts all the same";
