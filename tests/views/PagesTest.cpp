@@ -38,7 +38,8 @@ TEST_P(PageLook, HasNoFaultFromThePicturesToTheSending) {
 TEST_P(PageLook, HasNoFaultWithAWholeFolderAndTheShopsOfACoupon) {
     Walk walk(
         GetParam(),
-        u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Branches]\n"
+        u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Paper]\nQuickSizes = 10/15, 13/18, "
+        u"20/30\n[Branches]\n"
         "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
         "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n[Guards]\nCareful = yes\n"_s);
     walk.program().state().coupon.HaKoopon = 1;
@@ -52,7 +53,7 @@ TEST_P(PageLook, HasNoFaultWithAWholeFolderAndTheShopsOfACoupon) {
     go(walk, u"Image7 :24-coupon-refuses !"_s);
     walk.program().state().coupon.MisparKoopon = 14;
     go(walk, u"Image7 :24-panel-in-front Command21 :24-branches Command4Snif(10) :24-closing-coupon "
-             "showCoarse :24-coarse"_s);
+             "! showCoarse :24-coarse"_s);
 }
 
 TEST_P(PageLook, HasNoFaultWhileAnEditedOrderIsPrepared) {
