@@ -4,7 +4,7 @@ import shutil
 import socket
 import threading
 
-from cases import Case, Workspace
+from cases import ANOTHER, CUSTOMER, FOLDER, Case, Workspace
 from faults import Fault
 from kills import ORDERS
 from relay import Act, Relay
@@ -59,7 +59,14 @@ class Pair(Case):
         host = None
         if self.way == 'ftp':
             host = f'127.0.0.1:{(self.relay if workspace is self.mine else self.second_relay).port}'
-        return workspace.begin(self.order_of, self.way, lab=self.lab(workspace, host=host), **more)
+        order = self.order_of if workspace is self.mine else self.of_another_customer()
+        return workspace.begin(order, self.way, lab=self.lab(workspace, host=host), **more)
+
+    def of_another_customer(self):
+        """Logs of one customer and one second would be one text."""
+        scenario = self.folder / 'another.scenario'
+        scenario.write_text((FOLDER / f'{self.order_of}.scenario').read_text().replace(CUSTOMER, ANOTHER))
+        return scenario
 
     def send(self, workspace, **more):
         self.begin(workspace, **more)
