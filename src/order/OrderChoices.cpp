@@ -42,10 +42,8 @@ QList<Choice> choicesIn(SessionState& state) {
                              {u"Shemot.Girsa"_s, &shemot.Girsa},
                              {u"TelZalam"_s, &album.TelZalam},
                              {u"KamutHorim"_s, &album.KamutHorim},
-                             {u"SoogHorim"_s, &album.SoogHorim},
-                             {u"Tosafot1_5"_s, &album.Tosafot1.back()},
-                             {u"Tosafot2_9"_s, &album.Tosafot2.back()}};
-    for (const OrderField& field : detailFields(shemot) + albumFields(album)) {
+                             {u"SoogHorim"_s, &album.SoogHorim}};
+    for (const OrderField& field : lastExtras(album) + detailFields(shemot) + albumFields(album)) {
         if (auto* const* text = std::get_if<QString*>(&field.value))
             choices += {field.key, *text};
         else if (auto* const* number = std::get_if<std::int16_t*>(&field.value))

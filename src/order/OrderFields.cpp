@@ -16,16 +16,33 @@ OrderFields detailFields(OrderDetails& shemot) {
             {u"Shemot.maat"_s, &shemot.maat},     {u"Shemot.FillFit"_s, &shemot.FillFit}};
 }
 
+namespace {
+
+QString extraKey(std::size_t number) {
+    return u"Tosafot1_%1"_s.arg(number);
+}
+
+QString specialExtraKey(std::size_t number) {
+    return u"Tosafot2_%1"_s.arg(number);
+}
+
+} // namespace
+
 OrderFields albumFields(AlbumDetails& album) {
     OrderFields fields = {{u"GodelLBM"_s, &album.GodelLBM},   {u"Hearot"_s, &album.HearotLBM},
                           {u"MailZalam"_s, &album.MailZalam}, {u"ShemErooa"_s, &album.ShemErooa},
                           {u"ShemZalam"_s, &album.ShemZalam}, {u"SoogKricha"_s, &album.SoogKricha},
                           {u"SoogLBM"_s, &album.SoogLBM},     {u"SoogNiar"_s, &album.SoogNiar}};
     for (std::size_t i = 1; i < album.Tosafot1.size(); ++i)
-        fields += {u"Tosafot1_%1"_s.arg(i), &album.Tosafot1[i - 1]};
+        fields += {extraKey(i), &album.Tosafot1[i - 1]};
     for (std::size_t i = 1; i < album.Tosafot2.size(); ++i)
-        fields += {u"Tosafot2_%1"_s.arg(i), &album.Tosafot2[i - 1]};
+        fields += {specialExtraKey(i), &album.Tosafot2[i - 1]};
     return fields;
+}
+
+OrderFields lastExtras(AlbumDetails& album) {
+    return {{extraKey(album.Tosafot1.size()), &album.Tosafot1.back()},
+            {specialExtraKey(album.Tosafot2.size()), &album.Tosafot2.back()}};
 }
 
 } // namespace lumora

@@ -22,7 +22,10 @@ using OrderFields = QList<OrderField>;
 
 // In the order of the log.
 OrderFields detailFields(OrderDetails& shemot);
-// The keys count the extras from 1. The last extra of each list is not in the log and not among them.
+// The keys count the extras from 1.
 OrderFields albumFields(AlbumDetails& album);
+
+// The last extra of each list, which the log leaves out.
+OrderFields lastExtras(AlbumDetails& album);
 
 } // namespace lumora
