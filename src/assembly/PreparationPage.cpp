@@ -123,7 +123,7 @@ void PreparationPage::goOnWithout() {
 
 void PreparationPage::goBack() {
     if (m_leftOut.goBack())
-        RemoveOrderGoneBackFrom(m_state, m_platform);
+        TakeOrderBack(m_state, m_platform);
 }
 
 void PreparationPage::leaveProgram() {

@@ -28,7 +28,7 @@ Bitmap SmallLeftOut(const SessionState& state, const Files& files, int index, in
 }
 
 // The thumbnails of the order sheet go too, since the next sheet shows all that are there.
-void RemoveOrderGoneBackFrom(SessionState& state, const Platform& platform) {
+void TakeOrderBack(SessionState& state, const Platform& platform) {
     const Files& files = platform.files;
     const DrivePath thumbnails = WorkspacePaths::jobFolder(state);
     for (const QString& name : files.names(thumbnails, u"*.bmp"_s))

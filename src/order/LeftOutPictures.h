@@ -17,6 +17,6 @@ Bitmap SmallLeftOut(const SessionState& state, const Files& files, int index, in
 
 // Removes the folder of the chosen order, from whose box the customer went back to the pictures, and what was made for
 // its sheet. A failure is told.
-void RemoveOrderGoneBackFrom(SessionState& state, const Platform& platform);
+void TakeOrderBack(SessionState& state, const Platform& platform);
 
 } // namespace lumora

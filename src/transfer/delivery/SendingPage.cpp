@@ -129,7 +129,7 @@ Bitmap SendingPage::smallLeftOut(int index, int cell) const {
 
 void SendingPage::goBack() {
     if (!isUnderWay(m_phase) && m_leftOut.goBack())
-        RemoveOrderGoneBackFrom(m_state, m_platform);
+        TakeOrderBack(m_state, m_platform);
 }
 
 void SendingPage::enter(SendingPhase phase) {
