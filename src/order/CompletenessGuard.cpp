@@ -1,17 +1,13 @@
 #include "order/CompletenessGuard.h"
 
 #include "order/OrderCompleteness.h"
-#include "order/OrderFolder.h"
-#include "platform/Platform.h"
 #include "session/SessionState.h"
 
 namespace lumora {
 
-bool CompletenessGuard::maySend(const OrderFolder& folder, const QStringList& names) const {
+bool CompletenessGuard::maySend(const OrderCompleteness& counts) const {
     if (!m_state.Careful)
         return true;
-    const OrderCompleteness counts =
-        OrderCompleteness::read(m_platform.files, folder, names, DamagedPrints(m_platform.files, folder));
     switch (counts.verdict()) {
     case OrderCompleteness::Verdict::None:
         tellNoPicture(counts);

@@ -1,10 +1,7 @@
 #pragma once
 
-#include <QStringList>
-
 namespace lumora {
 
-class OrderFolder;
 struct OrderCompleteness;
 struct Platform;
 struct SessionState;
@@ -17,8 +14,8 @@ public:
         : m_state(state)
         , m_platform(platform) {}
 
-    // names: leaf names of the files that would be sent. Shows a message or a question, whose loop may close the page.
-    bool maySend(const OrderFolder& folder, const QStringList& names) const;
+    // Shows a message or a question, whose loop may close the page.
+    bool maySend(const OrderCompleteness& counts) const;
 
 private:
     // The words, in CompletenessGuardTexts.cpp.

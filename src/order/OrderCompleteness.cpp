@@ -6,6 +6,7 @@
 #include "order/PieceName.h"
 #include "order/PrintFileName.h"
 #include "platform/files/Files.h"
+#include "session/SessionState.h"
 
 #include <QMap>
 #include <QSet>
@@ -64,9 +65,9 @@ OrderCompleteness::Verdict OrderCompleteness::verdict() const {
 }
 
 OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& present, const QStringList& marked,
-                                        const QStringList& damagedNames) {
+                                        const QStringList& damagedFiles) {
     const auto whole = [&](QStringList names) {
-        names.removeIf([&](const QString& name) { return damagedNames.contains(name); });
+        names.removeIf([&](const QString& name) { return damagedFiles.contains(name); });
         return static_cast<int>(PrintsAmong(names).size());
     };
     OrderCompleteness counts;
@@ -74,6 +75,7 @@ OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& 
     counts.present = whole(present);
     counts.marked = whole(marked);
     counts.damaged = all - counts.present;
+    counts.damagedFiles = damagedFiles;
     if (log)
         counts.named = printsNamedBy(*log);
     else if (counts.damaged > 0)
@@ -81,19 +83,21 @@ OrderCompleteness OrderCompleteness::of(const OrderLog* log, const QStringList& 
     return counts;
 }
 
-OrderCompleteness OrderCompleteness::read(const Files& files, const OrderFolder& folder, const QStringList& marked,
-                                          const QStringList& damagedNames) {
+OrderCompleteness OrderCompleteness::read(const SessionState& state, const Files& files, const OrderFolder& folder,
+                                          const QStringList& marked) {
     const QStringList present = files.names(folder.path(), printPatterns);
     const std::optional<OrderLog> log = ReadOrderLog(files, folder);
-    return of(log ? &*log : nullptr, present, marked, damagedNames);
+    return of(log ? &*log : nullptr, present, marked, DamagedPrints(state, files, folder));
 }
 
-QStringList DamagedPrints(const Files& files, const OrderFolder& folder) {
-    const Result<OrderState> state = ReadOrderState(files, folder);
+QStringList DamagedPrints(const SessionState& state, const Files& files, const OrderFolder& folder) {
+    if (!state.Careful)
+        return {};
+    const Result<OrderState> kept = ReadOrderState(files, folder);
     QStringList names = files.names(folder.path(), printPatterns);
     names.removeIf([&](const QString& name) {
         const Result<qint64> length = files.size(folder.filePath(name));
-        return length && *length > 0 && (!state || state->lengths.value(name, *length) == *length);
+        return length && *length > 0 && (!kept || kept->lengths.value(name, *length) == *length);
     });
     return names;
 }

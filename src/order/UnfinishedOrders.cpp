@@ -71,8 +71,7 @@ bool canGoOn(const SessionState& session, const Files& files, const UnfinishedOr
         return false;
     if (state.hasArrived())
         return state.onlyReportIsLeft();
-    const QStringList names = files.names(order.folder.path(), u"*"_s);
-    return OrderCompleteness::read(files, order.folder, names).verdict() != OrderCompleteness::Verdict::None;
+    return !PrintsAmong(files.names(order.folder.path(), printPatterns)).isEmpty();
 }
 
 bool isNewer(const UnfinishedOrder& order, const UnfinishedOrder& other) {

@@ -49,12 +49,10 @@ void MoogMeret::sendByMail() {
 }
 
 bool MoogMeret::mayBeMailed() {
-    const QStringList marked = LeafNames(List1.items());
-    const OrderFolder order(m_files.folder());
-    const QStringList damaged = m_state.Careful ? DamagedPrints(m_platform.files, order) : QStringList();
-    m_walksWholeOrder = OrderCompleteness::read(m_platform.files, order, marked, damaged).verdict() ==
-                        OrderCompleteness::Verdict::Whole;
-    return CompletenessGuard(m_state, m_platform).maySend(order, marked) && mayAct();
+    const auto counts =
+        OrderCompleteness::read(m_state, m_platform.files, OrderFolder(m_files.folder()), LeafNames(List1.items()));
+    m_walksWholeOrder = counts.verdict() == OrderCompleteness::Verdict::Whole;
+    return CompletenessGuard(m_state, m_platform).maySend(counts) && mayAct();
 }
 
 // After a stop, with the same files marked, the customer chooses whether what was sent is sent again.

@@ -231,11 +231,12 @@ void SendingPage::tellNotKept() const {
 }
 
 bool SendingPage::mayBeSent(const QStringList& paths) {
-    const OrderFolder order = OrderFolder::chosen(m_state);
-    const QStringList damaged = m_state.Careful ? DamagedPrints(m_platform.files, order) : QStringList();
+    const auto counts =
+        OrderCompleteness::read(m_state, m_platform.files, OrderFolder::chosen(m_state), LeafNames(paths));
+    const QStringList& damaged = counts.damagedFiles;
     if (!damaged.isEmpty())
         tellReason(LineStep::PrintCut, {Failure::Kind::Damaged, damaged.join(u", "_s)}, damaged.first());
-    return CompletenessGuard(m_state, m_platform).maySend(order, LeafNames(paths));
+    return CompletenessGuard(m_state, m_platform).maySend(counts);
 }
 
 bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken) {

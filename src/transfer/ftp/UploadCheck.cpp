@@ -109,7 +109,7 @@ void UploadCheck::freshConnection() {
 }
 
 bool UploadCheck::lookUp() {
-    const QString& name = m_transfer.ShemTikiya;
+    const QString& name = m_state.transfer.ShemTikiya;
     const QStringList before = m_lists.List6.items();
     // Some servers cut a long listing.
     if ((!m_lists.List5.contains(name) && !m_session.provesArrival()) || !m_session.enterListedFolder(name))
@@ -176,7 +176,7 @@ void UploadCheck::prove() {
 }
 
 QStringList UploadCheck::restOfOrder() const {
-    const OrderFolder order(m_transfer.OrderFolder);
+    const OrderFolder order(m_state.transfer.OrderFolder);
     const QStringList entries = m_files.names(order.path(), ftpOrderPattern);
     QStringList rest = FtpOrderFiles(m_files, order, entries, TravelsInPieces(order.name()));
     rest.removeIf([&](const QString& path) { return m_lists.List4Makor.contains(path); });
@@ -184,7 +184,7 @@ QStringList UploadCheck::restOfOrder() const {
 }
 
 Arrival UploadCheck::orderThere() {
-    const OrderFolder order(m_transfer.OrderFolder);
+    const OrderFolder order = OrderFolder::chosen(m_state);
     const QStringList rest = restOfOrder();
     // The server may hold only a part of a file that an earlier sending has not confirmed.
     const QStringList unconfirmed = m_session.journal()->state().filesInHand + ReadBrokenFiles(m_files, order);
@@ -196,7 +196,7 @@ Arrival UploadCheck::orderThere() {
     const std::optional<OrderLog> log = ReadOrderLog(m_files, order);
     const QStringList there = m_lists.List6.items();
     return arrivalBy(
-        OrderCompleteness::of(log ? &*log : nullptr, there, there, DamagedPrints(m_files, order)).verdict());
+        OrderCompleteness::of(log ? &*log : nullptr, there, there, DamagedPrints(m_state, m_files, order)).verdict());
 }
 
 Arrival UploadCheck::arrivalByNames() const {
@@ -206,9 +206,8 @@ Arrival UploadCheck::arrivalByNames() const {
 }
 
 OrderCompleteness UploadCheck::completeness() const {
-    const OrderFolder order(m_transfer.OrderFolder);
-    return OrderCompleteness::read(m_files, order, LeafNames(m_lists.List4Makor.items()),
-                                   m_session.provesArrival() ? DamagedPrints(m_files, order) : QStringList());
+    return OrderCompleteness::read(m_state, m_files, OrderFolder::chosen(m_state),
+                                   LeafNames(m_lists.List4Makor.items()));
 }
 
 Arrival UploadCheck::arrivalBy(OrderCompleteness::Verdict verdict) {

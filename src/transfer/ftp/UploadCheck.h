@@ -15,7 +15,7 @@ class UploadCheck {
 public:
     UploadCheck(const SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
                 FtpLists& lists, FtpSession& session)
-        : m_transfer(state.transfer)
+        : m_state(state)
         , m_platform(platform)
         , m_files(platform.files)
         , m_pump(platform.pump)
@@ -77,7 +77,7 @@ private:
 
     void endSilent();
 
-    const TransferState& m_transfer;
+    const SessionState& m_state;
     const Platform& m_platform;
     const Files& m_files;
     EventPump& m_pump;

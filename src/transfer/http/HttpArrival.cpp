@@ -40,8 +40,7 @@ void HttpArrival::postUnconfirmed(const QString& path) {
 std::optional<OrderCompleteness> HttpArrival::lacking(const OrderFolder& order, const QStringList& names) const {
     if (!m_state.Careful)
         return std::nullopt;
-    const OrderCompleteness counts =
-        OrderCompleteness::read(m_platform.files, order, names, DamagedPrints(m_platform.files, order));
+    const OrderCompleteness counts = OrderCompleteness::read(m_state, m_platform.files, order, names);
     return counts.verdict() == OrderCompleteness::Verdict::Fewer ? std::optional(counts) : std::nullopt;
 }
 
