@@ -27,7 +27,7 @@ void Form2::load() {
 void Form2::setTexts() {
     setCaptions(m_state, {
                              {Label1, u"מארז תמונות", u"Preparing your pictures"},
-                             {Command1, u"הסר תמונה זו מהרשימה", u"Remove this picture from the list"},
+                             {Command1, u"הסר תמונה זו מהרשימה", u"Remove this picture"},
                              {Command3, u"הכן את ההזמנה", u"Prepare the order"},
                              {Command4, u"הצג דף אלבום", u"Show the album sheet"},
                              {Command5, u"צייר שוב את התמונות", u"Draw the pictures again"},
