@@ -112,6 +112,17 @@ TEST_P(SendingLook, HasNoFaultByFtpFromTheCountThroughAFailureToTheEnd) {
 }
 
 TEST_P(SendingLook, HasNoFaultByFtpAtTheEndsThatAreNoFailure) {
+    lab.deadCalls = FakeLab::always;
+    auto& untold = open<FtpFrm>([&](SessionState& state) {
+        state.profile.ReportOn = 1;
+        state.Careful = true;
+    });
+    startNow(untold);
+    EXPECT_TRUE(untold.phase() == SendingPhase::Success && untold.reportUnknown());
+    look(walk, u"24-sent-untold"_s);
+
+    walk.program().state().Careful = false;
+    remote().clear();
     remote()[u"stranger.jpp"_s] = "x";
     auto& there = open<FtpFrm>();
     startNow(there);

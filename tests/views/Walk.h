@@ -5,6 +5,7 @@
 #include "session/Page.h"
 #include "support/DrivePathLiteral.h"
 
+#include <QDir>
 #include <QSize>
 #include <QString>
 #include <QStringList>
@@ -86,7 +87,7 @@ private:
     void expectDone(const Result<void>& step);
     void writeFrames();
 
-    QTemporaryDir m_folder;
+    QTemporaryDir m_folder{QDir::tempPath() + u"/with-a-path-as-long-as-those-of-memory-cards-XXXXXX"_s};
     std::unique_ptr<Program> m_program;
 };
 

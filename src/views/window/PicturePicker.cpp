@@ -5,6 +5,7 @@
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
+#include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
 
 #include <QKeyEvent>
@@ -143,7 +144,7 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     m_up = wordButton(u"pickerUp"_s, "plain", state.wording(u"תיקייה מעל"_s, u"Folder above"_s),
                       [this] { open(m_folder.parent_path()); });
     setButtonIcon(m_up, theme, u"folder-up"_s, Theme::Colour::Ink);
-    m_where = oneLine("strong");
+    m_where = new ElidedLabel("strong", this);
     makeGrid();
     addRow({side, {inColumn(Space::Small, {inRow(Space::Normal, {m_up, {m_where, 1}}), {m_grid, 1}}), 1}}, Space::Far);
     column()->setStretch(column()->count() - 1, 1);
@@ -279,8 +280,7 @@ void PicturePicker::open(const HostPath& folder) {
         if (m_places[i].folder == folder)
             m_placeButtons[i]->setChecked(true);
     }
-    m_where->setText(fromLeft(m_where->fontMetrics().elidedText(toText(folder), Qt::ElideLeft, m_theme.px(480))));
-    m_where->setToolTip(toText(folder));
+    m_where->setWhole(toText(folder));
 
     std::vector<HostPath> folders;
     std::vector<HostPath> files;

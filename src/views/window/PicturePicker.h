@@ -13,6 +13,7 @@
 
 namespace lumora {
 
+class ElidedLabel;
 class Files;
 struct SessionState;
 
@@ -56,7 +57,7 @@ private:
     std::vector<Place> m_places;
     std::vector<QPushButton*> m_placeButtons;
     HostPath m_folder;
-    QLabel* m_where;
+    ElidedLabel* m_where;
     QLabel* m_empty;
     QPushButton* m_up;
     QPushButton* m_take;
