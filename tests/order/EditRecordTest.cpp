@@ -82,6 +82,10 @@ TEST(EditRecord, UnpacksByPositionAndReadsBlanksAsTheirDefaults) {
     EXPECT_EQ(fields.TextBody, u"שלום  עולם");
     PackEditState(fields, u"NB"_s, {});
     EXPECT_EQ(fields.EditState.toStdString(), record.toStdString());
+
+    UnpackEditState(u"x.290.5 -   xy 180x%"_s, fields);
+    EXPECT_EQ((std::array{fields.GainR, fields.GainG, fields.GainB}), (std::array{1.0F, 0.5F, 1.0F}))
+        << "what is no number would print black";
 }
 
 TEST(EditRecord, CarriesTheOrdersBorderAsAFrame) {

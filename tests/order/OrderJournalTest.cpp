@@ -83,6 +83,19 @@ TEST_F(AJournal, keepsEachStepAndWritesNothingWhereNothingChanges) {
     }
 }
 
+TEST_F(AJournal, keepsTheMarksOfItsFirstStartWhereAnOrderGoesOn) {
+    SessionState session = exampleOrder();
+    session.Optint = OrderKind::Print;
+    const auto marksWith = [&](const char* picture) {
+        EXPECT_TRUE(test.files.writeWhole(u"C:\\a.jpg"_path, picture));
+        EXPECT_TRUE(OrderJournal(test.files, folder).begin(session, Way::Ftp, {u"1 1015GNBC:\\a.jpg"_s}, {}));
+        return stored().marks.value(0);
+    };
+    const QString first = marksWith("a picture");
+    EXPECT_FALSE(first.isEmpty());
+    EXPECT_EQ(marksWith("that of another card"), first);
+}
+
 TEST_F(AJournal, makesAStateForAnOrderThatHasNoneAtItsFirstStep) {
     give(u"!105_1234.jpg"_s);
     EXPECT_FALSE(OrderJournal(test.files, folder).known());

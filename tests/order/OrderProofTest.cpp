@@ -45,6 +45,8 @@ TEST(AnArrival, isProvenByEachNameAndEachLength) {
         {"no proof picture", "000.jpg=5", "", exact, "000.jpg||||"},
         {"both letter cases there, ours is cut", "a.jpp=9", "A.jpp=9 a.jpp=4", anyCase, "|a.jpp|||"},
         {"a name told twice, once with its length", "a.jpp=9", "a.jpp a.jpp=8", exact, "|a.jpp|||"},
+        {"cut and sent again under another letter case", "a.jpp=9", "A.jpp=4 A.JPP=9", anyCase, "||a.jpp||"},
+        {"no length told of one alone", "A.jpp=9 B.jpp=9", "A.jpp=9 B.jpp", exact, "B.jpp||A.jpp||"},
         {"a file of the order twice", "a=1 a=1", "a=1", exact, "||a||"},
         {"an empty file and an empty server", "a=0", "", exact, "a||||"},
         {"an empty file that arrived", "a=0", "a=0", exact, "||a||"},

@@ -160,6 +160,8 @@ TEST(PrintFileName, carriesCodePlaceKindAndNameInHexadecimal) {
     EXPECT_EQ(read->copies(), 12);
 
     EXPECT_EQ((PrintFileName{u"1 1015GNB"_s, 12345, 10, u"a"_s}.text()), u"1 1015GNB2345_1061.jpp"_s);
+    EXPECT_EQ((PrintFileName{u"1 1015GNB"_s, 0, 1, u"#ABCDEFGHIJKLMNOPQRST"_s}.text()),
+              u"1 1015GNB0000_014142434445464748494A4B4C4D4E4F5051525354.jpp"_s);
     EXPECT_EQ(PrintBaseName(u"C:\\p\\0123456789012345678901234.jpg"_path), u"56789012345678901234"_s);
     for (const char* other :
          {"!105_1234.jpp", "121015MWB007_0361.jpp", "121015MWB0007_036.jpp", "121015MWB0007_03.jpp", ""})

@@ -83,22 +83,29 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     ASSERT_TRUE(test.files.writeWhole(
         lacks.logPath(),
         OrderLog::of(session, OrderLog::Layout::Plain, again.items, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
+    // The other one was sent after all.
+    OrderState late = inPhase(Phase::Prepared, u"110"_s);
+    late.replaces = u"2026_11_20_KUP_1234^109"_s;
+    give(late.replaces, inPhase(Phase::Sending, u"109"_s), {print});
+    give(u"2026_11_20_KUP_1234^110"_s, late, {print});
     // Not whole yet: the replaced order keeps its prints.
     OrderState underWay = inPhase(Phase::Preparing, u"106"_s);
     underWay.replaces = name;
     give(name, inPhase(Phase::Prepared), {print});
     give(u"2026_11_21_KUP_1234^106"_s, underWay);
     TidyOrders(session, test.files);
-    EXPECT_EQ(test.files.folders(orders),
-              QStringList({"2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name, "2026_11_21_KUP_1234^106",
-                           lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
+    EXPECT_EQ(
+        test.files.folders(orders),
+        QStringList({late.replaces, "2026_11_20_KUP_1234^110", "2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104",
+                     name, "2026_11_21_KUP_1234^106", lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
     EXPECT_FALSE(test.files.fileExists(orders / u"2026_11_21_KUP_1234^102" / u".log-there"));
     EXPECT_EQ(ReadOrderState(test.files, anew)->replaces, QString()) << "its number may come again";
     EXPECT_EQ(ReplacementOf(session, test.files, OrderFolder(orders / name))->name(), u"2026_11_21_KUP_1234^106");
     give(name, inPhase(Phase::Sending));
     EXPECT_FALSE(ReplacementOf(session, test.files, OrderFolder(orders / name))) << "it was sent after all";
     give(name, inPhase(Phase::Prepared));
-    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^108", "2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104"}))
+    EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^108", "2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104",
+                                      "2026_11_20_KUP_1234^110", late.replaces}))
         << "the replaced one waits";
 }
 
@@ -192,6 +199,7 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
                   way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp);
         EXPECT_EQ(sending.transfer.OrderFolder, folder.path());
         EXPECT_EQ(sending.transfer.ShemTikiya, name + u'P');
+        EXPECT_EQ(sending.transfer.HazmanaP, 1);
         EXPECT_EQ(sending.transfer.Mefurak, Travel::Pieces);
         EXPECT_EQ(sending.transfer.SugMishloah, Sending::NewOrder);
         EXPECT_EQ(sending.MisparHazmana, u"105");

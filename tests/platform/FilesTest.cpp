@@ -122,7 +122,7 @@ TEST_F(FilesTest, KeepsACopyThatStaysWhenTheSourceIsReplacedOrRemoved) {
 
 TEST_F(FilesTest, StoresAnyBytesUnderALongHebrewNameAndFindsThemAgain) {
     const DrivePath path = u"C:\\"_path / (QString(200, QChar(0x05D0)) + u".jpg"_s);
-    const QByteArray bytes("\r\n\0\xff mixed\n", 11);
+    const QByteArray bytes = QByteArray("\r\n\0\xff mixed\n", 11).repeated(200000); // more than a copy takes at once
     ASSERT_TRUE(files.writeWhole(path, "old") && files.writeWhole(path, bytes));
     ASSERT_TRUE(files.copyFile(path, u"C:\\copy.txt"_path));
     EXPECT_EQ(files.read(path).value() + files.read(u"C:\\copy.txt"_path).value(), bytes + bytes);
