@@ -111,7 +111,7 @@ def at_each(act, words='GREETING USER PASS PWD TYPE EPSV CWD MKD DELE SIZE STOR 
 
 def many_lines(text):
     code = text[:3]
-    return f'{code}-one\n 999 two\n {code} is no end\n{code}-three\n{text}' if text else text
+    return f'{code}-one\n999 two\n {code} is no end\n{code}-three\n{text}' if text else text
 
 
 def without_parentheses(text):

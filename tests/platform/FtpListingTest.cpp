@@ -40,6 +40,7 @@ TEST(ParseFtpListing, ReadsALineByItsFieldsAndTheRestAsTheName) {
         {"d [RWCEAFMS] lab               512 Nov 21 03:47 orders", "orders", true},
         {"- [RWCEAFMS] lab            942417 Nov 21 03:47 a.jpp", "a.jpp", false, 942417},
         {"type=dir;modify=20261121034700; a folder", "a folder", true},
+        {"type=cdir;modify=20261121034700; .", ".", true},
         {"Type=file;Size=942417;Modify=20261121034700; a.jpp", "a.jpp", false, 942417},
         {"+i8388621.48594,m825718503,/,\ta folder", "a folder", true},
         {"+i8388621.48594,m825718503,r,s942417,\ta.jpp", "a.jpp", false, 942417},

@@ -300,7 +300,7 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
         Failure::Kind kind;
         int bytes;
     } cases[] = {
-        {"cut in the middle", "STOR 1 passed(cut=300_000)", Failure::Kind::Refused, 3'000'000},
+        {"cut in the middle", "STOR 1 passed(cut=300_000)", Failure::Kind::Refused, 9'000'000},
         {"cut behind what fits the buffers", "STOR 1 passed(cut=100)", Failure::Kind::Refused, 5'000},
         {"stalled", "STOR 1 passed(stall=300_000)", Failure::Kind::TimedOut, 9'000'000},
         {"closing reply bad", "STOR 1 closing('451 Disk full')", Failure::Kind::Refused, 5'000},
