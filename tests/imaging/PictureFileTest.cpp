@@ -2,6 +2,7 @@
 
 #include "JpegOfKind.h"
 #include "common/HostFile.h"
+#include "imaging/files/BmpFile.h"
 #include "imaging/scaling/Resample.h"
 #include "support/JpegQuality.h"
 #include "support/PictureDifference.h"
@@ -179,6 +180,16 @@ TEST_F(PictureFileTest, aWhiteOrTransparentPictureIsWhiteToItsEdgesAtEverySize) 
             EXPECT_EQ(meanDifference(*printed, wanted), 0) << path;
         }
         EXPECT_EQ(meanDifference(*loadPictureScaled(white, size), wanted), 0);
+    }
+    const fs::path clear = write("clear.jpg", *encodeJpeg(Bitmap(16, 16, QColor(255, 0, 0, 0)), 92));
+    EXPECT_EQ(meanDifference(*loadPicture(clear), Bitmap(16, 16, Qt::white)), 0);
+}
+
+TEST_F(PictureFileTest, aBitmapFileOfAnyWidthIsReadByOthers) {
+    for (const int width : {60, 61, 62, 63}) {
+        const Bitmap picture = testPicture(width, 40);
+        ASSERT_TRUE(saveBmp(picture, in("work.bmp")));
+        EXPECT_EQ(meanDifference(Bitmap(QImage(QString::fromStdString(in("work.bmp")))), picture), 0) << width;
     }
 }
 

@@ -19,7 +19,7 @@ class Fault:
         self.only = more.pop('only', ())        # the servers that it is played before; none: all
         self.again = more.pop('again', 0)       # files that may be sent twice, since the server's answers call for it
         self.literal = more.pop('literal', '')  # why a lie stays even with Careful
-        self.quick = more.pop('quick', False)   # also in ./test
+        self.quick = more.pop('quick', False)   # also with .ci/run's tests
         self.as_installed = more.pop('as_installed', False)  # the server changes files under TYPE A, and the lab has not set I
         self.heals = more.pop('heals', True)    # the server is good when the order is sent again
         self.plays = more.pop('plays', None)    # what the case plays in place of a sending and a resend

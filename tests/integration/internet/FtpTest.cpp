@@ -349,6 +349,16 @@ TEST_F(FtpTest, ReadsRepliesOfManyLinesThatComeLate) {
     EXPECT_EQ(ftp->lastResponse().count(u'\n'), 4);
 }
 
+TEST_F(FtpTest, LetsABusyServerGreetLaterAndCountsFoldersFromItsHome) {
+    relay.set("GREETING 1 lambda session, line: session.tell('120 In a moment')");
+    EXPECT_TRUE(connect());
+    fs::create_directory(lab.ordersFolder() / "below");
+    relay.set("PWD 1 reply('257 \"/zalamim234\"')");
+    auto ftp = connect();
+    ASSERT_TRUE(ftp);
+    EXPECT_TRUE(ftp->setCurrentDirectory(u"/below"_s));
+}
+
 TEST_F(FtpTest, TellsARefusedListingFromAnEmptyFolderAndEncryptionFromAWrongPassword) {
     auto ftp = connect();
     ASSERT_TRUE(ftp);
