@@ -413,6 +413,9 @@ TEST_F(ThePictures, askInTheClosingPanelForWhatTheLabWants) {
         EXPECT_EQ(state.DchisaAmoka, c.deep ? 1 : 0);
         EXPECT_EQ(shown.Text1.visible, c.asksForAddress) << c.policy;
         EXPECT_EQ(shown.Label33.visible, c.mustHaveOne) << c.policy;
+        if (c.asksForDepth)
+            page.Command21_Click();
+        EXPECT_EQ(state.DchisaAmoka, c.deep || c.asksForDepth ? 1 : 0);
         page.Command7_Click(); // without an address
         EXPECT_EQ(chain.front()->id(), PageId::Form2);
         EXPECT_EQ(state.shemot.Mail, u"לא הוקלד"_s);

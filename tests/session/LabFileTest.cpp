@@ -1,6 +1,7 @@
 #include "session/lab/LabFile.h"
 
 #include "common/HostFile.h"
+#include "session/SessionState.h"
 #include "session/lab/ClientProfile.h"
 
 #include <QFile>
@@ -51,6 +52,9 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               QStringList({"127.0.0.1:2121", " a;b#c=d ", "א", "20/30", "", "20/30", "03-5", "North", "2nd floor",
                            "משלוח לבית"}));
     EXPECT_EQ(profile.JppChunks, 32767);
+    SessionState state;
+    LoadDefaultProfile(state, lab);
+    EXPECT_TRUE(state.coupon.SmallCount == 220 && state.coupon.LargeCount == 3);
     EXPECT_TRUE(lab.SugTzad == 60 && lab.ftpType == FtpType::Image && lab.HaKoopon == 1 && lab.MinuyPaar == 2);
     EXPECT_TRUE(lab.keptFtpSession && !lab.DchisatAlbum && lab.SplitPage && lab.FitMuzag && lab.DoarReshut &&
                 lab.TachanaMekomit && !lab.OperatorArea && lab.OperatorEditor);
@@ -86,6 +90,7 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
         {"[Client]\nCode = a/b\n", {"Client.Code"}},
         {"[Lab]\nPhone = \xE6\xBC\xA2\n", {"Lab.Phone", "Windows-1255"}},
         {"[Paper]\nSizes = 10/15, 9/13\n", {"Paper.Sizes", "two digits"}},
+        {"[Paper]\nSizes = 10/15, 00/13\n", {"Paper.Sizes", "two digits"}},
         {"[Paper]\nQuickSizes = 10/15,10/15,10/15,10/15\n", {"Paper.QuickSizes", "1 to 3"}},
         {"[Addresses]\nSite = http://a.example\n", {"Addresses.Site", "slash"}},
         {"[Addresses]\nReport = ftp://a.example/x\n", {"Addresses.Report", "http://"}},
