@@ -49,11 +49,11 @@ TEST(VolumeMarkTest, TakesTheLastFourCharactersOfTheSerial) {
 TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
     using Place = DetailsProblem::Place;
     SessionState good;
-    takeDetails(good.shemot, u" Dana Levi "_s, u"call me"_s, QString());
+    takeDetails(good.shemot, u" Dana Levi "_s, u" call me "_s, QString());
     good.shemot.ppr = u"10/15"_s;
     good.shemot.maat = u"מט"_s;
     good.shemot.Bord = u"NB"_s;
-    EXPECT_EQ(good.shemot.n1, u"Dana Levi");
+    EXPECT_EQ(good.shemot.n1 + u',' + good.shemot.n2, u"Dana Levi,call me");
     EXPECT_FALSE(CheckDetails(good)) << "a telephone with letters passes";
 
     const std::pair<std::function<void(OrderDetails&)>, Place> cases[] = {
