@@ -137,6 +137,7 @@ TEST_F(ContactSheet, laysEveryPictureInLandscapeATurnedOneClockwise) {
         EXPECT_TRUE(isBlue(image.pixelColor(blue))) << blue.x();
     }
     EXPECT_EQ(image.pixelColor(87 + 10, 160), QColor(Qt::white));
+    EXPECT_EQ(image.pixelColor(86, 161 + 30), QColor(Qt::white));
 }
 
 TEST(OrderSheet, growsWithTheNumberOfItsThumbnails) {

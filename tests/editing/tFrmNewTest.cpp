@@ -96,6 +96,7 @@ TEST_F(TheEditor, takesTheStepsOfItsButtonsIntoTheRecord) {
                           Case{[&] { holdImage2(4, 6); }, EditRecord::GainG, "1.24"},
                           Case{[&] { holdImage2(3, 1); }, EditRecord::GainG, "1.2 "},
                           Case{[&] { editor.Image2_Click(6); }, EditRecord::GainR, "1.26"},
+                          Case{[&] { editor.keepRecord(); }, EditRecord::GainB, "1.14"},
                           Case{[&] { editor.Image2_Click(8); }, EditRecord::GainR, "1.2 "},
                           Case{[&] { editor.Image2_Click(10); }, EditRecord::GainB, "1.26"},
                           Case{[&] { editor.keepRecord(); }, EditRecord::GainR, "1.14"},
@@ -120,7 +121,9 @@ TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
         editor.PicPic_MouseMove({107, 100 - 13.0 / 6});
     EXPECT_FALSE(shown().Frame3.visible);
     EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
+    const QImage dragged = shown().PicPic.image();
     editor.PicPic_MouseUp();
+    EXPECT_EQ(shown().PicPic.image(), dragged);
     editor.PicPic_MouseMove({300, 300});
     EXPECT_EQ(storedField(EditRecord::PanX) + storedField(EditRecord::PanY),
               u"227 150 "_s); // 226.6, and 149.5 to the even one
