@@ -405,9 +405,22 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
         order.rig.write(FtpFrmRig::first(), QByteArray(500, 'x') + '\r');
         onFirst(1, [](const QByteArray& content) { return Content(content.chopped(1)); })(order);
     };
+    // An earlier run was cut in the first file; whether that put was confirmed is not known, or was never kept.
+    const auto cutInTheFirst = [](bool inHand) {
+        return [=](Guarded& order) {
+            order.keep({}, true);
+            for (const auto& [name, bytes] : order.rig.localFiles())
+                order.remote()[name] = name == FtpFrmRig::first() ? bytes.chopped(1) : bytes;
+            EXPECT_TRUE(!inHand || order.journal().take(FtpFrmRig::local(FtpFrmRig::first()).text()));
+        };
+    };
+    const int theFirstAndTheSharedName = 2 - static_cast<int>(FtpFrmRig::names().size());
     using enum SendingPhase;
     const Case cases[] = {
         {"whole", [](Guarded&) {}, Success, 0, true, false, Success},
+        {"cut in the first file", cutInTheFirst(false), Success, theFirstAndTheSharedName, true, false, Success},
+        {"cut in the first file, which is in hand", cutInTheFirst(true), Success, theFirstAndTheSharedName, true, false,
+         Success},
         {"half of a file, once", onFirst(1, half), Success, 1, true, false, Success},
         {"the one CR of a picture is missing", oneCrMissing, Success, 1, true, false, Success},
         {"half of a file, and nothing tells lengths", halfUntold, Success, 0, true, true, Success},
