@@ -16,7 +16,7 @@ SUITES = {
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
     'editing': ('editing', 'selection', 'assembly', 'scenarios', 'views'), 'selection': ('selection', 'scenarios', 'views'),
-    'assembly': ('assembly', 'scenarios'), 'transfer': ('transfer', 'integration_transfer', 'scenarios', 'views'),
+    'assembly': ('assembly', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios', 'views'),
     'finished': ('finished', 'integration_mail', 'scenarios', 'views'), 'entry': ('entry', 'scenarios', 'views'),
     'start': ('start', 'scenarios', 'views'), 'views': ('views', 'drive'), 'app': ('drive', 'scenarios', 'views')}
 
