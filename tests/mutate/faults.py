@@ -16,7 +16,7 @@ SUITES = {
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
     'editing': ('editing', 'selection', 'assembly', 'scenarios', 'views'), 'selection': ('selection', 'scenarios', 'views'),
-    'assembly': ('assembly', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios', 'views'),
+    'assembly': ('assembly', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios'),
     'finished': ('finished', 'integration_mail', 'scenarios', 'views'), 'entry': ('entry', 'scenarios', 'views'),
     'start': ('start', 'scenarios', 'views'), 'views': ('views', 'drive'), 'app': ('drive', 'scenarios', 'views')}
 
@@ -191,7 +191,8 @@ FAULTS = {
         F('numbers[4] * 256 + numbers[5]', 'numbers[4] + numbers[5] * 256', 'no file goes where EPSV is not known'),
         F('reply.code == 0 || reply.code == code', 'true', 'a reply of several lines is cut', seen=True),
         F('direction == Direction::Up ? endOfPut(data.socket) : noFailure()', 'noFailure()', 'a cut behind the last bytes counts as sent', seen=True),
-        F('data.setLinger(true, 0);', '', 'a part of a file that can not be read on counts as the whole'),
+        F('data.setLinger(true, 0);', '', 'a part of a file that can not be read on counts as the whole',
+          told='the put fails in either case; a server keeps what it has, and only its own log tells the reset'),
         F('reason.code >= 400 ? refused(reason) : cut', 'cut', 'a full disk is told as a bad line'),
         F('reply.code == 213 && known && bytes >= 0 ? Length(bytes) : Length()', 'Length()', 'SIZE tells nothing'),
         F('m_home + directory', 'directory', 'orders land in another folder'),
@@ -223,7 +224,8 @@ FAULTS = {
     'src/imaging/drawing/ColourPlanes.cpp': [F('qRed(line[x])', 'qBlue(line[x])', 'prints have no red')],
     'src/imaging/drawing/ColourMatrix.cpp': [
         F('matrix.m_entries[4] = green;', 'matrix.m_entries[4] = red;', 'a change of red changes green too'),
-        F('value < 0.0F || value > 0.0015F', 'value < 0.0F || value > 0.5F', 'a grey picture stays in colour')],
+        F('value < 0.0F || value > 0.0015F', 'value < 0.0F || value > 0.5F', 'a grey picture stays in colour',
+          told='no matrix has ones in its diagonal and more than a thousandth beside it')],
     'src/imaging/drawing/CaptionDraw.cpp': [
         F('-length / 2', '-length', 'a caption in the middle stands at the side'),
         F('place.rotate(90);', '', 'a caption that runs down lies'),
@@ -315,7 +317,8 @@ FAULTS = {
         F('m_failed += picture.text();', '', 'the log hides pictures that were left out'),
         F('m_state.transfer.leftOut += LeftOut{picture, why};', '', 'the customer is not told of pictures left out'),
         F('m_state.Careful && m_prints == 0 && m_there.isEmpty()', 'false', 'an order without a print is sent'),
-        F('m_goesOn && m_journal->state().items == m_lines', 'm_goesOn', 'prints of another basket stay'),
+        F('m_goesOn && m_journal->state().items == m_lines', 'm_goesOn', 'prints of another basket stay',
+          told='an order that is taken up starts at once with the lines of its state'),
         F('m_there.isEmpty() && !PrintFits(m_state, m_platform.files, print)', 'false', 'an order has prints of two shapes')],
     'src/assembly/OrderSheet.cpp': [
         F('{70, {660, 880}, {660, 880}},', '{MUTATED ? 71 : 70, {660, 880}, {660, 880}},', 'sheets of 71 pictures are too small', seen=True),
@@ -329,15 +332,18 @@ FAULTS = {
         F('ending == u"JPG" || ending == u"jpg"', 'ending == u"jpg"', 'pictures of most cameras are left out'),
         F('!there.contains(i) && picture.hasUsableName() && !HasQuestionMark(items[i])', '!there.contains(i) && picture.hasUsableName()',
           'each print behind an odd name is that of its neighbour'),
-        F('RightPart(split(line).path.stem(), 9)', 'RightPart(split(line).path.stem(), 8)', 'the sheet cuts the names'),
+        F('RightPart(split(line).path.stem(), 9)', 'RightPart(split(line).path.stem(), 8)', 'the sheet cuts the names',
+          told='a letter of a caption; log and print carry the whole name'),
         F('encodeJpeg(*drawn, printQuality)', 'encodeJpeg(*drawn, 50)', 'the sheet is coarse')],
     'src/assembly/edited/EditedPreparation.cpp': [
         F('OrderTail::shortWidth', 'OrderTail::longWidth', 'edited orders have a tail that the lab does not read'),
-        F('name.size() - 8', 'name.size() - 4', 'captions of the sheet are longer')],
+        F('name.size() - 8', 'name.size() - 4', 'captions of the sheet are longer',
+          told='the ending stands in a caption too; log and print carry the name')],
     'src/assembly/edited/EditedPrints.cpp': [F('edit.ToneFlag != 1', 'true', 'grey pictures print in colour')],
 
     'src/transfer/ftp/FtpArrival.cpp': [
-        F('!found || entry.length > found->length', 'true', 'of two lengths the last is believed'),
+        F('!found || entry.length > found->length', 'true', 'of two lengths the last is believed',
+          told='no server lists a name twice in one folder; a wrong length is asked for by SIZE'),
         F('found && found->there && *found->there != found->here', 'false', 'a part that lies there is never replaced'),
         F('found && found->there == found->here', 'found.has_value()', 'a part that lies there counts as whole'),
         F('found.there = asked;', '', 'SIZE does not overrule the listing')],
