@@ -183,14 +183,29 @@ PictureSize JpegReader::size() const {
     return {static_cast<int>(m_state->info.image_width), static_cast<int>(m_state->info.image_height)};
 }
 
+JpegReader::Colours JpegReader::colours() const {
+    if (!m_state->inks())
+        return Colours::Light;
+    return m_state->info.saw_Adobe_marker != FALSE ? Colours::InkLights : Colours::Inks;
+}
+
 Result<Bitmap> JpegReader::readBitmap(int denominator) {
+    return readRows(denominator, false);
+}
+
+Result<Bitmap> JpegReader::readStoredInks() {
+    return readRows(1, true);
+}
+
+Result<Bitmap> JpegReader::readRows(int denominator, bool inksAsStored) {
     State& s = *m_state;
     if (!s.start(denominator, s.inks() ? JCS_CMYK : bitmapColours))
         return s.failure();
     QImage image(static_cast<int>(s.info.output_width), static_cast<int>(s.info.output_height), QImage::Format_RGB32);
     if (image.isNull())
         return pictureFailure(s.input.path(), Failure::Kind::TooLarge, u"memory is short"_s);
-    std::vector<unsigned char> inks(s.inks() ? static_cast<std::size_t>(image.width()) * 4 : 0);
+    const bool converted = s.inks() && !inksAsStored;
+    std::vector<unsigned char> inks(converted ? static_cast<std::size_t>(image.width()) * 4 : 0);
     for (int y = 0; y < image.height(); ++y) {
         if (!s.readLine(image.scanLine(y), inks))
             return s.failure();

@@ -27,6 +27,12 @@ public:
     // or readPlanes uses the reader up.
     Result<Bitmap> readBitmap(int denominator = 1);
 
+    // Light is given by readBitmap. Of inks readStoredInks gives the four bytes of each pixel as the file has them: the
+    // ink, or the light that it lets through.
+    enum class Colours { Light, Inks, InkLights };
+    Colours colours() const;
+    Result<Bitmap> readStoredInks();
+
     // True when the file stores luma and chroma planes, or luma alone; readPlanes gives them as stored. For other
     // pictures (RGB, inks) readPlanes converts pixels, which takes longer.
     bool hasPlanes() const;
@@ -38,6 +44,7 @@ private:
     struct State;
     explicit JpegReader(std::unique_ptr<State> state);
 
+    Result<Bitmap> readRows(int denominator, bool inksAsStored);
     Result<void> readRawPlanes(PlaneTaker& taker);
     Result<void> readMadePlanes(PlaneTaker& taker);
 

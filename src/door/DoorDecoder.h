@@ -1,0 +1,34 @@
+#pragma once
+
+#include "common/Result.h"
+#include "door/Confinement.h"
+#include "door/DoorNeed.h"
+
+#include <filesystem>
+
+namespace lumora {
+
+// Makes the JPEG file that the pages work with of a picture file of any kind. What takes more than a copy is done by a
+// child process without rights, since decoders of strangers' formats are where attacks come in. Calls block; several
+// threads may call.
+class DoorDecoder {
+public:
+    // program is lumora-door; where it is missing every decoding fails.
+    explicit DoorDecoder(std::filesystem::path program, DoorLimits limits = {});
+
+    // Reads the header alone.
+    static Result<DoorNeed> needOf(const std::filesystem::path& source);
+
+    struct Made {
+        bool profileIgnored = false; // the colour profile is broken, so that the colours were taken as sRGB
+    };
+    // The target holds the whole new picture, or what it held before: Damaged, TooLarge, TimedOut and Unsupported are
+    // the picture's failures, NoSpace and others the disk's.
+    Result<Made> make(const std::filesystem::path& source, const std::filesystem::path& target) const;
+
+private:
+    std::filesystem::path m_program;
+    DoorLimits m_limits;
+};
+
+} // namespace lumora

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "door/PictureHeader.h"
+
+#include <QString>
+
+namespace lumora {
+
+// What a file needs to be an upright sRGB JPEG of the ending .jpg.
+enum class DoorNeed {
+    Nothing,
+    Copy, // only its ending is another
+    Turn,
+    Decode, // another format, or other colours
+    Unreadable,
+};
+
+// The colours of a picture by its header, the strongest word first: profile, coded and named colours, EXIF.
+struct HeaderColours {
+    enum class Source { None, Profile, Named, HighRange } source = Source::None;
+    PictureColours named;
+    bool profileIgnored = false;
+};
+HeaderColours coloursOf(const PictureHeader& header);
+
+// Colours by the numbers of a video standard; none where they are sRGB's, or not told.
+HeaderColours codedColours(PictureHeader::CodedColours coded);
+
+DoorNeed doorNeedOf(const PictureHeader& header, const QString& fileName);
+
+} // namespace lumora

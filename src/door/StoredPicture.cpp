@@ -1,0 +1,259 @@
+#include "door/StoredPicture.h"
+
+#include "common/HostFile.h"
+#include "imaging/files/OtherPictures.h"
+
+#include <QBuffer>
+#include <QColorSpace>
+#include <QImageReader>
+
+#include <ctime>
+#include <utility>
+
+#include <libheif/heif.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr qint64 maxFile = 256 << 20;
+
+const char* qtNameOf(PictureKind kind) {
+    switch (kind) {
+    case PictureKind::Png:
+        return "png";
+    case PictureKind::WebP:
+        return "webp";
+    case PictureKind::Tiff:
+        return "tiff";
+    case PictureKind::Bmp:
+        return "bmp";
+    case PictureKind::Gif:
+        return "gif";
+    default:
+        return nullptr;
+    }
+}
+
+template <class Object, void (*release)(Object*)>
+struct Releaser {
+    void operator()(Object* object) const { release(object); }
+};
+template <class Object, void (*release)(Object*)>
+using Handle = std::unique_ptr<Object, Releaser<Object, release>>;
+
+void releaseImage(const heif_image* image) {
+    heif_image_release(image);
+}
+
+void releasePrimary(const heif_image_handle* handle) {
+    heif_image_handle_release(handle);
+}
+
+HeaderColours heifColours(const heif_image_handle* handle) {
+    heif_color_profile_nclx* coded = nullptr;
+    if (heif_image_handle_get_nclx_color_profile(handle, &coded).code != heif_error_Ok || coded == nullptr)
+        return {};
+    const HeaderColours colours = codedColours({coded->color_primaries, coded->transfer_characteristics});
+    heif_nclx_color_profile_free(coded);
+    return colours;
+}
+
+// Qt's reader takes a GIF file that is cut short for whole; the data of a frame ends with an empty block.
+bool hasWholeGifFrame(const QByteArray& bytes) {
+    const auto byte = [&bytes](qint64 at) { return at < bytes.size() ? static_cast<uchar>(bytes[at]) : -1; };
+    const auto tableSize = [](int flags) { return (flags & 0x80) != 0 ? 3 << ((flags & 7) + 1) : 0; };
+    qint64 at = 13 + tableSize(byte(10));
+    bool isFrame = false;
+    while (!isFrame) {
+        isFrame = byte(at) == 0x2C;
+        if (!isFrame && byte(at) != 0x21)
+            return false;
+        at += isFrame ? 10 + tableSize(byte(at + 9)) + 1 : 2;
+        while (byte(at) > 0)
+            at += byte(at) + 1;
+        if (byte(at++) < 0)
+            return false;
+    }
+    return true;
+}
+
+} // namespace
+
+Result<std::unique_ptr<StoredPictureReader>> StoredPictureReader::open(const std::filesystem::path& path) {
+    auto bytes = readWholeFile(path, QString::fromLocal8Bit(path.c_str()), maxFile);
+    if (!bytes)
+        return bytes.failure();
+    std::unique_ptr<StoredPictureReader> reader(new StoredPictureReader(path));
+    reader->m_bytes = std::move(*bytes);
+    reader->m_kind = pictureKindOf(reader->m_bytes);
+    if (reader->m_kind == PictureKind::Jpeg || reader->m_kind == PictureKind::Bmp) {
+        auto input = PictureInput::open(path);
+        if (!input)
+            return input.failure();
+        reader->m_input.emplace(std::move(*input));
+    } else if (reader->m_kind == PictureKind::Heif || reader->m_kind == PictureKind::Avif) {
+        heif_init(nullptr);
+    }
+    // What asks for files on its first call does so here: the profiles of LittleCMS note the time, Qt's reader loads
+    // its plugin.
+    tzset();
+    QImageReader::setAllocationLimit(0);
+    if (const char* name = qtNameOf(reader->m_kind)) {
+        QBuffer nothing;
+        nothing.open(QIODevice::ReadOnly);
+        (void)QImageReader(&nothing, name).canRead();
+    }
+    return reader;
+}
+
+const PictureHeader& StoredPictureReader::header() {
+    if (!m_header) {
+        m_header = readPictureHeader(PictureBytes(
+            [this](qint64 at, qint64 count) { return at <= m_bytes.size() ? m_bytes.mid(at, count) : QByteArray(); }));
+    }
+    return *m_header;
+}
+
+Result<StoredPicture> StoredPictureReader::read() {
+    StoredPicture picture;
+    picture.colours = coloursOf(header());
+    picture.profile = header().profile;
+    picture.orientation = header().orientation;
+    if (picture.colours.source == HeaderColours::Source::HighRange)
+        return pictureFailure(m_path, Failure::Kind::Unsupported, u"the picture has a high dynamic range"_s);
+    const bool toldBefore = m_kind == PictureKind::Jpeg || m_kind == PictureKind::Png || m_kind == PictureKind::Bmp;
+    if (auto fits = checkSize(header().size.width, header().size.height); toldBefore && !fits)
+        return fits.failure();
+    switch (m_kind) {
+    case PictureKind::None:
+        return pictureFailure(m_path, Failure::Kind::Unsupported, u"is no picture of a known kind"_s);
+    case PictureKind::Jpeg:
+        return readJpeg(std::move(picture));
+    case PictureKind::Heif:
+    case PictureKind::Avif:
+        return readHeif();
+    case PictureKind::Bmp: {
+        auto bitmap = readOtherPicture(*m_input);
+        if (!bitmap)
+            return bitmap.failure();
+        picture.image = bitmap->image();
+        return picture;
+    }
+    default:
+        return readByQt(std::move(picture));
+    }
+}
+
+Result<StoredPicture> StoredPictureReader::readJpeg(StoredPicture picture) {
+    auto reader = JpegReader::open(std::move(*m_input));
+    if (!reader)
+        return reader.failure();
+    using Pixels = SrgbConversion::Pixels;
+    const auto colours = (*reader)->colours();
+    const Pixels pixels = colours == JpegReader::Colours::Light  ? Pixels::Light
+                          : colours == JpegReader::Colours::Inks ? Pixels::Inks
+                                                                 : Pixels::InkLights;
+    // Inks whose profile is of no use are turned to light as those without one.
+    const bool byProfile = pixels != Pixels::Light && picture.colours.source == HeaderColours::Source::Profile &&
+                           SrgbConversion::ofProfile(picture.profile, pixels);
+    auto bitmap = byProfile ? (*reader)->readStoredInks() : (*reader)->readBitmap();
+    if (!bitmap)
+        return bitmap.failure();
+    picture.image = std::move(bitmap->image());
+    picture.pixels = byProfile ? pixels : Pixels::Light;
+    if (pixels != Pixels::Light && !byProfile && picture.colours.source != HeaderColours::Source::None)
+        picture.colours = {HeaderColours::Source::None, {}, true};
+    return picture;
+}
+
+Result<StoredPicture> StoredPictureReader::readHeif() {
+    const Handle<heif_context, heif_context_free> context(heif_context_alloc());
+    heif_context_set_max_decoding_threads(context.get(), 0);
+    if (heif_context_read_from_memory_without_copy(context.get(), m_bytes.constData(),
+                                                   static_cast<std::size_t>(m_bytes.size()), nullptr)
+            .code != heif_error_Ok)
+        return damaged();
+    heif_image_handle* found = nullptr;
+    if (heif_context_get_primary_image_handle(context.get(), &found).code != heif_error_Ok)
+        return damaged();
+    const Handle<const heif_image_handle, releasePrimary> handle(found);
+    if (auto fits = checkSize(heif_image_handle_get_width(found), heif_image_handle_get_height(found)); !fits)
+        return fits.failure();
+
+    StoredPicture picture;
+    picture.colours = heifColours(found);
+    if (picture.colours.source == HeaderColours::Source::HighRange)
+        return pictureFailure(m_path, Failure::Kind::Unsupported, u"the picture has a high dynamic range"_s);
+    if (const std::size_t size = heif_image_handle_get_raw_color_profile_size(found); size > 0) {
+        picture.profile.resize(static_cast<qsizetype>(size));
+        (void)heif_image_handle_get_raw_color_profile(found, picture.profile.data());
+        PictureHeader header;
+        header.profile = picture.profile;
+        const HeaderColours byProfile = coloursOf(header);
+        if (byProfile.profileIgnored)
+            picture.colours.profileIgnored = true;
+        else
+            picture.colours = byProfile;
+    }
+    const Handle<heif_decoding_options, heif_decoding_options_free> options(heif_decoding_options_alloc());
+    options->convert_hdr_to_8bit = 1;
+    heif_image* decoded = nullptr;
+    if (heif_decode_image(found, &decoded, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, options.get()).code !=
+        heif_error_Ok)
+        return damaged();
+    const Handle<const heif_image, releaseImage> image(decoded);
+    int stride = 0;
+    const uchar* pixels = heif_image_get_plane_readonly(decoded, heif_channel_interleaved, &stride);
+    const QImage::Format format = heif_image_handle_has_alpha_channel(found) == 0 ? QImage::Format_RGBX8888
+                                  : heif_image_handle_is_premultiplied_alpha(found) != 0
+                                      ? QImage::Format_RGBA8888_Premultiplied
+                                      : QImage::Format_RGBA8888;
+    const QImage seen(pixels, heif_image_get_width(decoded, heif_channel_interleaved),
+                      heif_image_get_height(decoded, heif_channel_interleaved), stride, format);
+    picture.image =
+        seen.convertToFormat(format == QImage::Format_RGBX8888 ? QImage::Format_RGB32 : QImage::Format_ARGB32);
+    return picture;
+}
+
+Result<StoredPicture> StoredPictureReader::readByQt(StoredPicture picture) {
+    if (m_kind == PictureKind::Gif && !hasWholeGifFrame(m_bytes))
+        return damaged();
+    QBuffer buffer(&m_bytes);
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer, qtNameOf(m_kind));
+    reader.setAutoDetectImageFormat(false);
+    reader.setAutoTransform(m_kind == PictureKind::Tiff);
+    if (!reader.size().isValid())
+        return damaged();
+    if (auto fits = checkSize(reader.size().width(), reader.size().height()); !fits)
+        return fits.failure();
+    picture.image = reader.read();
+    if (picture.image.isNull())
+        return damaged();
+    if (picture.colours.source == HeaderColours::Source::Profile || m_kind == PictureKind::Tiff) {
+        if (picture.profile.isEmpty()) {
+            PictureHeader header;
+            header.profile = picture.profile = picture.image.colorSpace().iccProfile();
+            header.profileBroken = picture.profile.isEmpty() && m_kind != PictureKind::Tiff;
+            picture.colours = coloursOf(header);
+        }
+    }
+    return picture;
+}
+
+Result<void> StoredPictureReader::checkSize(qint64 width, qint64 height) const {
+    if (auto bounds = checkPictureBounds(m_path, width, height); !bounds)
+        return bounds;
+    if (width * height > maxDoorPixels)
+        return pictureFailure(m_path, Failure::Kind::TooLarge, u"the picture has more than 100 million pixels"_s);
+    return {};
+}
+
+Failure StoredPictureReader::damaged() const {
+    return pictureFailure(m_path, Failure::Kind::Damaged, u"this file is damaged"_s);
+}
+
+} // namespace lumora

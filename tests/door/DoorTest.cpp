@@ -1,0 +1,401 @@
+#include "Corpus.h"
+#include "common/HostFile.h"
+#include "door/DoorDecoder.h"
+#include "imaging/files/PictureFile.h"
+#include "support/JpegQuality.h"
+#include "support/SmallDisk.h"
+
+#include <QColorSpace>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cmath>
+#include <filesystem>
+
+#include <lcms2.h>
+
+namespace lumora {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+namespace fs = std::filesystem;
+
+class DoorTest : public testing::Test {
+protected:
+    fs::path in(const std::string& name) const { return fs::path(m_folder.path().toStdString()) / name; }
+    fs::path write(const std::string& name, const QByteArray& bytes) const {
+        EXPECT_TRUE(writeWholeFile(in(name), bytes));
+        return in(name);
+    }
+    static QByteArray read(const fs::path& path) {
+        const auto bytes = readWholeFile(path, u"the result"_s, 1 << 30);
+        return bytes ? *bytes : QByteArray();
+    }
+    Result<DoorDecoder::Made> make(const QByteArray& bytes, const DoorDecoder& decoder) const {
+        return decoder.make(write("source", bytes), in("target.jpg"));
+    }
+    QByteArray made(const QByteArray& bytes, bool* profileIgnored = nullptr) const {
+        const auto result = make(bytes, m_decoder);
+        EXPECT_TRUE(result) << (result ? "" : result.failure().message.toStdString());
+        if (result && profileIgnored != nullptr)
+            *profileIgnored = result->profileIgnored;
+        return result ? read(in("target.jpg")) : QByteArray();
+    }
+    // Nothing but the source is left.
+    void expectRefused(const QByteArray& bytes, Failure::Kind kind, const DoorDecoder& decoder) const {
+        fs::remove(in("target.jpg"));
+        const auto result = make(bytes, decoder);
+        ASSERT_FALSE(result);
+        EXPECT_EQ(result.failure().kind, kind) << result.failure().message.toStdString();
+        EXPECT_EQ(std::distance(fs::directory_iterator(in("")), fs::directory_iterator()), 1);
+    }
+
+    QTemporaryDir m_folder;
+    const DoorDecoder m_decoder{LUMORA_DOOR};
+};
+
+using Lab = cmsCIELab;
+
+// What LittleCMS makes of colours in floating point, of the channels a profile has.
+std::vector<Lab> labOf(const QByteArray& profile, cmsUInt32Number format, const std::vector<double>& channels) {
+    cmsHPROFILE source = profile.isEmpty()
+                             ? cmsCreate_sRGBProfile()
+                             : cmsOpenProfileFromMem(profile.constData(), cmsUInt32Number(profile.size()));
+    cmsHPROFILE srgb = cmsCreate_sRGBProfile();
+    cmsHPROFILE lab = cmsCreateLab4Profile(nullptr);
+    constexpr auto flags = cmsFLAGS_NOOPTIMIZE | cmsFLAGS_NOCACHE | cmsFLAGS_BLACKPOINTCOMPENSATION;
+    cmsHTRANSFORM first = cmsCreateTransform(source, format, srgb, TYPE_RGB_DBL, INTENT_PERCEPTUAL, flags);
+    cmsHTRANSFORM second =
+        cmsCreateTransform(srgb, TYPE_RGB_DBL, lab, TYPE_Lab_DBL, INTENT_RELATIVE_COLORIMETRIC, flags);
+    const auto count = static_cast<cmsUInt32Number>(channels.size() / T_CHANNELS(format));
+    std::vector<double> light(std::size_t(count) * 3);
+    cmsDoTransform(first, channels.data(), light.data(), count);
+    for (double& value : light)
+        value = std::clamp(value, 0.0, 1.0);
+    std::vector<Lab> result(count);
+    cmsDoTransform(second, light.data(), result.data(), count);
+    for (cmsHTRANSFORM transform : {first, second})
+        cmsDeleteTransform(transform);
+    for (cmsHPROFILE one : {source, srgb, lab})
+        cmsCloseProfile(one);
+    return result;
+}
+
+std::vector<Lab> labOf(const QByteArray& profile, const std::vector<QRgb>& colours) {
+    std::vector<double> channels;
+    for (const QRgb c : colours)
+        for (const int value : {qRed(c), qGreen(c), qBlue(c)})
+            channels.push_back(value / 255.0);
+    return labOf(profile, TYPE_RGB_DBL, channels);
+}
+
+void expectColours(const QByteArray& jpeg, const std::vector<Lab>& wanted) {
+    const QImage picture = QImage::fromData(jpeg, "JPG");
+    ASSERT_FALSE(picture.isNull());
+    const std::vector<Lab> found = labOf({}, middlesOf(picture));
+    ASSERT_EQ(found.size(), wanted.size());
+    double sum = 0, worst = 0;
+    for (std::size_t i = 0; i < found.size(); ++i) {
+        const double difference = cmsDeltaE(&found[i], &wanted[i]);
+        sum += difference;
+        worst = std::max(worst, difference);
+    }
+    EXPECT_LT(sum / double(found.size()), 0.7);
+    EXPECT_LT(worst, 3);
+}
+
+int worstDifference(const QImage& a, const QImage& b) {
+    int worst = a.size() == b.size() ? 0 : 255;
+    for (int i = 0; worst < 255 && i < a.width() * a.height(); ++i) {
+        const QRgb p = a.pixel(i % a.width(), i / a.width()), q = b.pixel(i % a.width(), i / a.width());
+        worst = std::max(
+            {worst, std::abs(qRed(p) - qRed(q)), std::abs(qGreen(p) - qGreen(q)), std::abs(qBlue(p) - qBlue(q))});
+    }
+    return worst;
+}
+
+PictureHeader headerOf(const QByteArray& file) {
+    return readPictureHeader(PictureBytes([&](qint64 at, qint64 count) { return file.mid(at, count); }));
+}
+
+QByteArray proPhotoProfile() {
+    return rgbProfile({0.7347, 0.2653, 0.1596, 0.8404, 0.0366, 0.0001}, 1.8);
+}
+
+TEST_F(DoorTest, ColoursOfEveryKindOfFileComeOutAsLittleCmsHasThemInFloats) {
+    const QImage picture = patches(256, 192);
+    QImage tagged = picture;
+    tagged.setColorSpace(QColorSpace::fromIccProfile(adobeProfile()));
+    const std::vector<QRgb> colours = middlesOf(picture);
+    const QByteArray jpeg = saved(picture, "JPG");
+    const std::vector<QRgb> stored = middlesOf(QImage::fromData(jpeg));
+    const QByteArray png = saved(picture, "PNG");
+    const QByteArray broken = p3Profile().replace("acsp", "xxxx"), cut = p3Profile().left(300);
+    const unsigned wide[] = {31270, 32900, 64000, 33000, 21000, 71000, 15000, 6000};
+    QByteArray adobeLights;
+    for (const unsigned number : wide)
+        adobeLights += bigEndian({number});
+    const QByteArray bt2020 = rgbProfile({0.708, 0.292, 0.170, 0.797, 0.131, 0.046}, 0);
+    struct Case {
+        const char* name;
+        QByteArray file;
+        std::vector<Lab> wanted;
+        bool profileIgnored = false;
+    };
+    const Case cases[] = {
+        {"P3 in parts", jpegWith(jpeg, {}, p3Profile(), 100), labOf(p3Profile(), stored)},
+        {"AdobeRGB", jpegWith(jpeg, {}, adobeProfile()), labOf(adobeProfile(), stored)},
+        {"ProPhoto", jpegWith(jpeg, {}, proPhotoProfile()), labOf(proPhotoProfile(), stored)},
+        {"ProPhoto behind 64 KB", jpegWith(jpegWith(jpeg, {}, proPhotoProfile()), exif(1) + QByteArray(65000, 'x')),
+         labOf(proPhotoProfile(), stored)},
+        {"R03", jpegWith(jpeg, exif(1, true)), labOf(adobeProfile(), stored)},
+        {"R03 with a broken profile", jpegWith(jpeg, exif(1, true), broken), labOf(adobeProfile(), stored), true},
+        {"P3 that is cut", jpegWith(jpeg, exif(6), cut), {}, true},
+        {"PNG", png, labOf({}, colours)},
+        {"PNG of 16 bits", saved(tagged.convertToFormat(QImage::Format_RGBA64), "PNG"), labOf(adobeProfile(), colours)},
+        {"PNG with a profile", saved(tagged, "PNG"), labOf(adobeProfile(), colours)},
+        {"PNG with gAMA and cHRM", pngWith(png, {{"gAMA", bigEndian({45455})}, {"cHRM", adobeLights}}),
+         labOf(rgbProfile({0.64, 0.33, 0.21, 0.71, 0.15, 0.06}, 0), colours)},
+        {"PNG with gAMA of 1.8", pngWith(png, {{"gAMA", bigEndian({55556})}}),
+         labOf(rgbProfile({0.64, 0.33, 0.30, 0.60, 0.15, 0.06}, 1.8), colours)},
+        {"PNG of codes", pngWith(png, {{"cICP", QByteArray("\x09\x0D\0\1", 4)}}), labOf(bt2020, colours)},
+        {"palette", saved(picture.convertToFormat(QImage::Format_Indexed8, Qt::ThresholdDither), "PNG"),
+         labOf({}, colours)},
+        {"WebP", saved(picture, "WEBP"), labOf({}, colours)},
+        {"TIFF", saved(tagged, "TIFF"), labOf(adobeProfile(), colours)},
+        {"BMP", saved(picture, "BMP"), labOf({}, colours)},
+        {"GIF", gif(picture), labOf({}, colours)},
+    };
+    for (const Case& one : cases) {
+        SCOPED_TRACE(one.name);
+        bool profileIgnored = false;
+        const QByteArray result = made(one.file, &profileIgnored);
+        EXPECT_EQ(profileIgnored, one.profileIgnored);
+        if (!one.wanted.empty())
+            expectColours(result, one.wanted);
+    }
+}
+
+TEST_F(DoorTest, HeicAndAvifKeepTheirColours) {
+    const QImage picture = patches(256, 192);
+    const std::vector<QRgb> colours = middlesOf(picture);
+    struct Case {
+        const char* name;
+        HeifKind kind;
+        std::vector<Lab> wanted;
+    };
+    const Case cases[] = {
+        {"HEIC", {}, labOf({}, colours)},
+        {"P3", {.profile = p3Profile()}, labOf(p3Profile(), colours)},
+        {"P3 by codes", {.codes = {{12, 13}}}, labOf(p3Profile(), colours)},
+        {"a profile before codes", {.profile = adobeProfile(), .codes = {{12, 13}}}, labOf(adobeProfile(), colours)},
+        {"AVIF of codes", {.avif = true, .codes = {{12, 13}}}, labOf(p3Profile(), colours)},
+    };
+    for (const Case& one : cases) {
+        SCOPED_TRACE(one.name);
+        expectColours(made(heif(picture, one.kind)), one.wanted);
+    }
+    for (const int curve : {16, 18}) {
+        expectRefused(heif(picture, {.codes = {{9, curve}}}), Failure::Kind::Unsupported, m_decoder);
+    }
+}
+
+TEST_F(DoorTest, GreysAndInksFollowTheirProfiles) {
+    const QImage picture = patches(256, 192);
+    const QImage grey = QImage::fromData(saved(picture.convertToFormat(QImage::Format_Grayscale8), "JPG"));
+    std::vector<double> channels;
+    for (const QRgb c : middlesOf(grey))
+        channels.push_back(qRed(c) / 255.0);
+    const QByteArray profile = greyProfile(1.4);
+    expectColours(made(jpegWith(saved(grey.convertToFormat(QImage::Format_Grayscale8), "JPG"), {}, profile)),
+                  labOf(profile, TYPE_GRAY_DBL, channels));
+
+    channels.clear();
+    for (const QRgb c : middlesOf(picture))
+        for (const int light : {qRed(c), qGreen(c), qBlue(c), 0xE0})
+            channels.push_back(100 - light / 2.55);
+    const QByteArray inks = inksProfile();
+    expectColours(made(inksJpeg(picture, inks)), labOf(inks, TYPE_CMYK_DBL, channels));
+
+    // Without one, and with one of light, the inks are turned to light as ever.
+    const auto plain = loadPicture(write("inks.jpg", inksJpeg(picture, {})));
+    ASSERT_TRUE(plain);
+    bool profileIgnored = false;
+    expectColours(made(inksJpeg(picture, p3Profile()), &profileIgnored), labOf({}, middlesOf(plain->image())));
+    EXPECT_TRUE(profileIgnored);
+}
+
+TEST_F(DoorTest, WhatCanBeSeenThroughLiesOnWhite) {
+    QImage picture(64, 64, QImage::Format_ARGB32);
+    picture.fill(QColor(200, 40, 0, 102));
+    const QImage deep = picture.convertToFormat(QImage::Format_RGBA64);
+    for (const QByteArray& file : {saved(picture, "PNG"), saved(deep, "PNG"), saved(picture, "WEBP"),
+                                   saved(picture, "TIFF"), heif(picture, {}), heif(picture, {.avif = true})}) {
+        const QRgb seen = QImage::fromData(made(file)).pixel(32, 32);
+        EXPECT_NEAR(qRed(seen), 233, 2);
+        EXPECT_NEAR(qGreen(seen), 169, 2);
+        EXPECT_NEAR(qBlue(seen), 153, 2);
+    }
+}
+
+TEST_F(DoorTest, EveryOrientationComesOutUpright) {
+    constexpr int asStored = 0; // each block turned, none encoded anew
+    const QByteArray bareGamma = rgbProfile({0.64, 0.33, 0.30, 0.60, 0.15, 0.06}, 2.2);
+    for (const QSize size : {QSize(128, 96), QSize(122, 94), QSize(121, 95)}) {
+        const QImage upright = patches(size.width(), size.height());
+        for (int orientation = 1; orientation <= 8; ++orientation) {
+            const QImage held = heldFor(upright, orientation);
+            const bool wholeBlocks = size.width() == 128 || orientation == 5;
+            const QByteArray jpeg = saved(held, "JPG", 83);
+            struct Case {
+                const char* name;
+                QByteArray file;
+                int quality;
+            };
+            const QByteArray tag = exif(orientation);
+            std::vector<Case> cases{
+                {"JPEG of other colours", jpegWith(jpeg, tag, bareGamma), 95},
+                {"PNG", pngWith(saved(held, "PNG"), {{"eXIf", tag}}), 95},
+                // The tag of such a file is only told.
+                {"HEIC", heif(held, {.orientation = orientation, .exif = QByteArray(4, '\0') + exif(6)}), 95},
+                {"AVIF", heif(held, {.avif = true, .orientation = orientation}), 95},
+            };
+            if (orientation > 1)
+                cases.push_back({"JPEG", jpegWith(jpeg, tag), wholeBlocks ? asStored : 97});
+            for (const Case& one : cases) {
+                SCOPED_TRACE(testing::Message() << one.name << " " << orientation << " " << size.width());
+                const QByteArray result = made(one.file);
+                const QImage found = QImage::fromData(result);
+                ASSERT_EQ(found.size(), size);
+                const PictureHeader::Place small = headerOf(result).smallPicture;
+                if (one.quality == asStored)
+                    EXPECT_LE(worstDifference(heldFor(found, orientation), QImage::fromData(one.file)), 4);
+                else
+                    EXPECT_EQ(jpegQuality(result.mid(small.at + small.length)), one.quality);
+                int far = 0;
+                const std::vector<QRgb> wanted = middlesOf(upright), seen = middlesOf(found);
+                for (std::size_t i = 0; i < seen.size(); ++i)
+                    far += std::abs(qGreen(seen[i]) - qGreen(wanted[i])) > 12 ? 1 : 0;
+                EXPECT_EQ(far, 0);
+            }
+        }
+    }
+}
+
+TEST_F(DoorTest, EachFileGetsNoMoreThanItNeeds) {
+    const QByteArray jpeg = saved(patches(64, 48), "JPG");
+    const QByteArray png = saved(patches(64, 48), "PNG");
+    const QByteArray srgb = srgbProfile("Wide Colours");
+    const QByteArray named =
+        rgbProfile({0.64, 0.33, 0.21, 0.71, 0.15, 0.06}, 2.2).replace("RGB built-in", "sRGB IEC6196");
+    struct Case {
+        const char* name;
+        QByteArray file;
+        DoorNeed need;
+    };
+    const Case cases[] = {
+        {"plain.jpg", jpeg, DoorNeed::Nothing},
+        {"CAMERA.JPG", jpegWith(jpeg, exif(1)), DoorNeed::Nothing},
+        {"srgb.jpg", jpegWith(jpeg, {}, srgb, 200), DoorNeed::Nothing},
+        {"bare-gamma.jpg", jpegWith(jpeg, {}, rgbProfile({0.64, 0.33, 0.30, 0.60, 0.15, 0.06}, 2.2)), DoorNeed::Decode},
+        {"broken.jpg", jpegWith(jpeg, {}, srgb.left(200)), DoorNeed::Nothing},
+        {"orientation-9.jpg", jpegWith(jpeg, exif(9)), DoorNeed::Nothing},
+        {"inks.jpg", inksJpeg(patches(64, 48), {}), DoorNeed::Nothing},
+        {"mixed.Jpg", jpeg, DoorNeed::Copy},
+        {"long.jpeg", jpeg, DoorNeed::Copy},
+        {"lies.png", jpeg, DoorNeed::Copy},
+        {"turned.png", jpegWith(jpeg, exif(8), srgb), DoorNeed::Turn},
+        {"called-srgb.jpg", jpegWith(jpeg, {}, named), DoorNeed::Decode},
+        {"r03.jpg", jpegWith(jpeg, exif(1, true)), DoorNeed::Decode},
+        {"r03-and-srgb.jpg", jpegWith(jpeg, exif(1, true), srgb), DoorNeed::Nothing},
+        {"lies.jpg", png, DoorNeed::Decode},
+        {"heic.jpg", heif(patches(64, 64), {}), DoorNeed::Decode},
+    };
+    for (const auto& [name, file, need] : cases) {
+        const auto found = DoorDecoder::needOf(write(name, file));
+        ASSERT_TRUE(found) << name;
+        EXPECT_EQ(*found, need) << name;
+    }
+    EXPECT_EQ(made(jpeg), jpeg);
+}
+
+TEST_F(DoorTest, TheSmallPictureInTheHeaderIsFoundAndWritten) {
+    const QByteArray small = saved(patches(32, 24), "JPG");
+    const QByteArray camera = jpegWith(saved(patches(64, 48), "JPG"), exif(3, false, small));
+    const PictureHeader header = headerOf(camera);
+    EXPECT_EQ(camera.mid(header.smallPicture.at, header.smallPicture.length), small);
+    EXPECT_EQ(header.size, (PictureSize{64, 48}));
+
+    const QByteArray result = made(saved(patches(320, 240), "PNG"));
+    const PictureHeader own = headerOf(result);
+    const QImage drawn = QImage::fromData(result.mid(own.smallPicture.at, own.smallPicture.length));
+    ASSERT_EQ(drawn.size(), QSize(160, 120));
+    expectColours(saved(drawn, "JPG"), labOf({}, middlesOf(patches(320, 240))));
+}
+
+TEST_F(DoorTest, FilesThatAreCutShortAreDamagedAndLeaveNothing) {
+    for (const auto& [name, file] : corpus()) {
+        for (const int percent : {30, 60, 95}) {
+            SCOPED_TRACE(testing::Message() << name << " " << percent);
+            expectRefused(file.left(file.size() * percent / 100), Failure::Kind::Damaged, m_decoder);
+        }
+    }
+}
+
+TEST_F(DoorTest, WhatIsNoPictureOrTooLargeIsToldBeforeItIsDecoded) {
+    const QByteArray png = saved(patches(1200, 900), "PNG");
+    QByteArray large = saved(patches(64, 48), "BMP");
+    large.replace(18, 8, QByteArray("\x40\x9C\0\0\x40\x9C\0\0", 8));
+    expectRefused({}, Failure::Kind::Damaged, m_decoder);
+    expectRefused("no picture", Failure::Kind::Unsupported, m_decoder);
+    expectRefused(large, Failure::Kind::TooLarge, m_decoder);
+    expectRefused(pngWith(png, {{"cICP", QByteArray("\x09\x10\0\1", 4)}}), Failure::Kind::Unsupported, m_decoder);
+    expectRefused(png, Failure::Kind::TooLarge, DoorDecoder(LUMORA_DOOR, {30, 32 << 20}));
+    expectRefused(png, Failure::Kind::NotFound, DoorDecoder(in("nowhere")));
+}
+
+TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
+    using Kind = Failure::Kind;
+    const DoorDecoder decoder(LUMORA_DOOR_MISBEHAVING, {1, qint64(256) << 20});
+    const std::pair<const char*, Kind> cases[] = {
+        {"loops", Kind::TimedOut},
+        {"waits", Kind::TimedOut},
+        {"eats memory", Kind::Damaged},
+        {"writes a file", Kind::Damaged},
+        {"reads a file", Kind::Damaged},
+        {"opens the net", Kind::Damaged},
+        {"begins a process", Kind::Damaged},
+        {"begins a program", Kind::Damaged},
+        {"runs its own code", Kind::Damaged},
+        {"says done", Kind::Damaged},
+        {"says done of rubbish", Kind::Damaged},
+        {"says done of half", Kind::Damaged},
+    };
+    for (const auto& [deed, kind] : cases) {
+        SCOPED_TRACE(deed);
+        expectRefused(saved(patches(8, 6), "PNG") + '\n' + deed, kind, decoder);
+    }
+    EXPECT_FALSE(fs::exists("/tmp/door-was-here"));
+}
+
+TEST_F(DoorTest, AFullDiskIsToldAndTheOldPictureStays) {
+    const SmallDisk disk(64);
+    if (!disk.available())
+        GTEST_SKIP();
+    const fs::path target = disk.path() / "target.jpg";
+    ASSERT_TRUE(writeWholeFile(target, "old"));
+    QImage noise(300, 300, QImage::Format_RGB32);
+    for (int i = 0; i < 90000; ++i)
+        noise.setPixel(i % 300, i / 300, 2654435761U * unsigned(i));
+    const auto result = m_decoder.make(write("noise.png", saved(noise, "PNG")), target);
+    ASSERT_FALSE(result);
+    EXPECT_EQ(result.failure().kind, Failure::Kind::NoSpace);
+    EXPECT_EQ(read(target), "old");
+    EXPECT_EQ(std::distance(fs::directory_iterator(disk.path()), fs::directory_iterator()), 1);
+}
+
+} // namespace
+} // namespace lumora

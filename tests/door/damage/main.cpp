@@ -1,0 +1,77 @@
+// Plays damaged files of all kinds through the door: each ends as a picture that is whole or as a failure, within the
+// limits, and leaves nothing else. door_damage [--count 1000] [--seed 1]
+
+#include "Corpus.h"
+#include "common/HostFile.h"
+#include "door/DoorDecoder.h"
+#include "imaging/files/JpegCheck.h"
+
+#include <QTemporaryDir>
+
+#include <cstdio>
+#include <cstdlib>
+#include <map>
+#include <random>
+#include <string>
+
+using namespace lumora;
+namespace fs = std::filesystem;
+
+namespace {
+
+QByteArray damaged(QByteArray bytes, std::mt19937& random) {
+    const auto place = [&](qsizetype size) { return static_cast<qsizetype>(random() % static_cast<unsigned>(size)); };
+    for (unsigned left = 1 + random() % 8; left > 0 && bytes.size() > 1; --left) {
+        // Headers are short and decide much.
+        const qsizetype at = place(random() % 2 == 0 ? std::min<qsizetype>(bytes.size(), 700) : bytes.size());
+        switch (random() % 8) {
+        case 0:
+            bytes.truncate(at);
+            break;
+        case 1:
+            bytes.remove(at, 1 + place(64));
+            break;
+        case 2:
+            bytes.insert(at, bytes.mid(place(bytes.size()), 1 + place(64)));
+            break;
+        default:
+            bytes[at] = static_cast<char>(random() % 4 == 0 ? 0xFF : random());
+        }
+    }
+    return bytes;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    std::map<std::string, int> options{{"--count", 1000}, {"--seed", 1}};
+    for (int i = 1; i + 1 < argc; i += 2)
+        options[argv[i]] = std::atoi(argv[i + 1]);
+    std::mt19937 random(static_cast<unsigned>(options["--seed"]));
+    const auto files = corpus();
+    const QTemporaryDir folder;
+    const fs::path home = folder.path().toStdString();
+    const DoorDecoder decoder(LUMORA_DOOR, {10, qint64(1) << 30});
+    std::map<std::string, int> ends;
+    for (int i = 0; i < options["--count"]; ++i) {
+        const auto& [name, whole] = files[static_cast<std::size_t>(i) % files.size()];
+        const QByteArray bytes = damaged(whole, random);
+        fs::remove(home / "target.jpg");
+        if (!writeWholeFile(home / "source", bytes))
+            return 2;
+        const auto made = decoder.make(home / "source", home / "target.jpg");
+        const bool decoded = made && *DoorDecoder::needOf(home / "source") >= DoorNeed::Turn;
+        const bool there = fs::exists(home / "target.jpg");
+        const auto left = std::distance(fs::directory_iterator(home), fs::directory_iterator());
+        if (there != made.ok() || left != (there ? 2 : 1) || (decoded && !checkJpegDecodes(home / "target.jpg"))) {
+            (void)writeWholeFile("door-fault-" + std::to_string(i), bytes);
+            std::printf("%s, variant %d of seed %d is a fault; door-fault-%d has it\n", name.c_str(), i,
+                        options["--seed"], i);
+            return 1;
+        }
+        ++ends[made ? "made" : "refused, kind " + std::to_string(static_cast<int>(made.failure().kind))];
+    }
+    for (const auto& [end, count] : ends)
+        std::printf("%s: %d\n", end.c_str(), count);
+    return 0;
+}
