@@ -1,5 +1,7 @@
 #include "door/Confinement.h"
 
+#include <QByteArray>
+
 #include <cerrno>
 #include <memory>
 
@@ -16,19 +18,6 @@ namespace lumora {
 
 namespace {
 
-// The sanitizers map terabytes for their own use.
-#if defined(__SANITIZE_ADDRESS__)
-constexpr bool memoryIsOurs = false;
-#elif defined(__has_feature)
-#if __has_feature(address_sanitizer)
-constexpr bool memoryIsOurs = false;
-#else
-constexpr bool memoryIsOurs = true;
-#endif
-#else
-constexpr bool memoryIsOurs = true;
-#endif
-
 bool limit(__rlimit_resource resource, rlim_t soft, rlim_t hard) {
     const rlimit value{soft, hard};
     return setrlimit(resource, &value) == 0;
@@ -38,36 +27,10 @@ struct FilterReleaser {
     void operator()(void* filter) const { seccomp_release(filter); }
 };
 
-constexpr int always[] = {
-    SCMP_SYS(read),
-    SCMP_SYS(pread64),
-    SCMP_SYS(write),
-    SCMP_SYS(lseek),
-    SCMP_SYS(close),
-    SCMP_SYS(munmap),
-    SCMP_SYS(mremap),
-    SCMP_SYS(madvise),
-    SCMP_SYS(brk),
-    SCMP_SYS(futex),
-    SCMP_SYS(set_robust_list),
-    SCMP_SYS(rseq),
-    SCMP_SYS(gettid),
-    SCMP_SYS(getpid),
-    SCMP_SYS(sched_yield),
-    SCMP_SYS(sched_getaffinity),
-    SCMP_SYS(sysinfo),
-    SCMP_SYS(rt_sigprocmask),
-    SCMP_SYS(rt_sigaction),
-    SCMP_SYS(rt_sigreturn),
-    SCMP_SYS(sigaltstack),
-    SCMP_SYS(clock_gettime),
-    SCMP_SYS(gettimeofday),
-    SCMP_SYS(getrandom),
-    SCMP_SYS(eventfd2),
-    SCMP_SYS(poll),
-    SCMP_SYS(exit),
-    SCMP_SYS(exit_group),
-};
+constexpr const char* always =
+    "read pread64 write lseek close munmap mremap madvise brk futex set_robust_list rseq gettid "
+    "getpid sched_yield sched_getaffinity sysinfo rt_sigprocmask rt_sigaction rt_sigreturn "
+    "sigaltstack clock_gettime gettimeofday getrandom eventfd2 poll exit exit_group";
 
 } // namespace
 
@@ -77,12 +40,13 @@ bool limitMyself(const DoorLimits& limits) {
     pthread_attr_t attributes;
     pthread_attr_init(&attributes);
     const bool stacked = pthread_attr_setstacksize(&attributes, std::size_t(1) << 20) == 0 &&
-                         pthread_setattr_default_np(&attributes) == 0 && mallopt(M_ARENA_MAX, 1) == 1;
+                         pthread_setattr_default_np(&attributes) == 0;
+    mallopt(M_ARENA_MAX, 1);
     pthread_attr_destroy(&attributes);
     const auto seconds = static_cast<rlim_t>(limits.seconds);
     const auto memory = static_cast<rlim_t>(limits.memory);
     return stacked && prctl(PR_SET_PDEATHSIG, SIGKILL) == 0 && limit(RLIMIT_CPU, seconds, seconds + 1) &&
-           (!memoryIsOurs || limit(RLIMIT_AS, memory, memory)) && limit(RLIMIT_FSIZE, memory, memory) &&
+           (!memoryIsLimited || limit(RLIMIT_AS, memory, memory)) && limit(RLIMIT_FSIZE, memory, memory) &&
            limit(RLIMIT_CORE, 0, 0);
 }
 
@@ -92,14 +56,16 @@ bool confineMyself() {
         return false;
     scmp_filter_ctx filter = owner.get();
     bool ok = seccomp_attr_set(filter, SCMP_FLTATR_CTL_TSYNC, 1) == 0;
-    for (const int call : always)
-        ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, call, 0) == 0;
+    for (const QByteArray& call : QByteArray(always).split(' '))
+        ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, seccomp_syscall_resolve_name(call.constData()), 0) == 0;
+    if (!memoryIsLimited)
+        ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, SCMP_SYS(pipe2), 0) == 0;
     // Memory that can be run is not given, nor is a process; clone3, whose flags can't be looked at, is as on an older
     // system.
-    const auto notRunnable = SCMP_A2(SCMP_CMP_MASKED_EQ, PROT_EXEC, 0);
-    const auto ofThread = SCMP_A0(SCMP_CMP_MASKED_EQ, CLONE_THREAD, CLONE_THREAD);
-    const auto ofName = SCMP_A0(SCMP_CMP_EQ, PR_SET_NAME);
-    const auto toAsk = SCMP_A2(SCMP_CMP_EQ, 0);
+    const scmp_arg_cmp notRunnable{2, SCMP_CMP_MASKED_EQ, PROT_EXEC, 0};
+    const scmp_arg_cmp ofThread{0, SCMP_CMP_MASKED_EQ, CLONE_THREAD, CLONE_THREAD};
+    const scmp_arg_cmp ofName{0, SCMP_CMP_EQ, PR_SET_NAME, 0};
+    const scmp_arg_cmp toAsk{2, SCMP_CMP_EQ, 0, 0};
     ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, SCMP_SYS(mmap), 1, notRunnable) == 0 &&
          seccomp_rule_add(filter, SCMP_ACT_ALLOW, SCMP_SYS(mprotect), 1, notRunnable) == 0 &&
          seccomp_rule_add(filter, SCMP_ACT_ALLOW, SCMP_SYS(clone), 1, ofThread) == 0 &&

@@ -4,6 +4,15 @@
 
 namespace lumora {
 
+// The sanitizers map terabytes for their own use, and try memory with a pipe.
+#if defined(__SANITIZE_ADDRESS__)
+inline constexpr bool memoryIsLimited = false;
+#elif defined(__has_feature)
+inline constexpr bool memoryIsLimited = !__has_feature(address_sanitizer);
+#else
+inline constexpr bool memoryIsLimited = true;
+#endif
+
 struct DoorLimits {
     int seconds = 30;
     qint64 memory = qint64(1) << 30;

@@ -12,6 +12,24 @@ using Source = HeaderColours::Source;
 
 constexpr int unspecified = 2;
 
+struct CodedLights {
+    int code;
+    Chromaticity white;
+    std::array<Chromaticity, 3> primaries;
+};
+
+constexpr Chromaticity daylight{0.3127, 0.3290};
+constexpr CodedLights codedLights[] = {
+    {4, {0.310, 0.316}, {{{0.67, 0.33}, {0.21, 0.71}, {0.14, 0.08}}}},
+    {5, daylight, {{{0.64, 0.33}, {0.29, 0.60}, {0.15, 0.06}}}},
+    {6, daylight, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
+    {7, daylight, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
+    {9, daylight, {{{0.708, 0.292}, {0.170, 0.797}, {0.131, 0.046}}}},
+    {11, {0.314, 0.351}, {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}}},
+    {12, daylight, {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}}},
+    {22, daylight, {{{0.630, 0.340}, {0.295, 0.605}, {0.155, 0.077}}}},
+};
+
 HeaderColours named(const PictureColours& colours) {
     return {Source::Named, colours, false};
 }
@@ -20,31 +38,11 @@ HeaderColours named(const PictureColours& colours) {
 
 HeaderColours codedColours(PictureHeader::CodedColours coded) {
     PictureColours colours;
-    switch (coded.primaries) {
-    case 4:
-        colours = {{0.310, 0.316}, {{{0.67, 0.33}, {0.21, 0.71}, {0.14, 0.08}}}, {}, 0};
-        break;
-    case 5:
-        colours.primaries = {{{0.64, 0.33}, {0.29, 0.60}, {0.15, 0.06}}};
-        break;
-    case 6:
-    case 7:
-        colours.primaries = {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}};
-        break;
-    case 9:
-        colours.primaries = {{{0.708, 0.292}, {0.170, 0.797}, {0.131, 0.046}}};
-        break;
-    case 11:
-        colours.white = {0.314, 0.351};
-        [[fallthrough]];
-    case 12:
-        colours.primaries = {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}};
-        break;
-    case 22:
-        colours.primaries = {{{0.630, 0.340}, {0.295, 0.605}, {0.155, 0.077}}};
-        break;
-    default:
-        break;
+    for (const CodedLights& lights : codedLights) {
+        if (lights.code == coded.primaries) {
+            colours.white = lights.white;
+            colours.primaries = lights.primaries;
+        }
     }
     using Curve = PictureColours::Curve;
     switch (coded.curve) {

@@ -111,7 +111,9 @@ QImage SrgbConversion::converted(QImage picture) const {
     if (picture.isNull())
         return {};
     // Pixels of one size are converted in place.
-    QImage result = deep ? QImage(picture.size(), format) : std::move(picture);
+    QImage result = deep ? QImage(picture.size(), format) : picture;
+    if (!deep)
+        picture = QImage();
     std::vector<quint16> greys(m_grey ? static_cast<std::size_t>(result.width()) * 2 : 0);
     const auto width = static_cast<cmsUInt32Number>(result.width());
     for (int y = 0; y < result.height(); ++y) {

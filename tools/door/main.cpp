@@ -2,7 +2,6 @@
 // called by hand, the door for one file.
 //
 //   lumora-door photo.heic photo.jpg
-//   lumora-door --needs photo.heic
 
 #include "door/DoorChild.h"
 #include "door/DoorDecoder.h"
@@ -22,13 +21,11 @@ enum ExitCode { allWell = 0, pictureFailed = 1, notUnderstood = 2 };
 
 constexpr std::string_view help =
     R"(Usage: lumora-door SOURCE TARGET.jpg
-       lumora-door --needs FILE...
 
 Makes an upright JPEG file in sRGB of a picture: JPEG, PNG, HEIC, AVIF, WebP, TIFF, BMP or GIF (its first frame), whatever its
 ending says. A JPEG that has only another ending is copied, one that only lies on its side is turned without a loss where its
 sides allow that; all others are decoded by a process that can open no file and no line.
 
-  --needs          tells of each file what it needs: nothing, copy, turn or decode
   --help, --version
 
 Exit status: 0 all is well, 1 a picture can't be read or the target can't be written, 2 the call can't be understood.
@@ -36,24 +33,6 @@ Exit status: 0 all is well, 1 a picture can't be read or the target can't be wri
 
 void complain(const QString& text) {
     std::fprintf(stderr, "lumora-door: %s\n", text.toLocal8Bit().constData());
-}
-
-int tellNeeds(const std::vector<std::string>& files) {
-    int code = allWell;
-    for (const std::string& file : files) {
-        const auto need = DoorDecoder::needOf(file);
-        if (!need) {
-            complain(need.failure().message);
-            code = pictureFailed;
-            continue;
-        }
-        const char* const word = *need == DoorNeed::Nothing ? "nothing"
-                                 : *need == DoorNeed::Copy  ? "copy"
-                                 : *need == DoorNeed::Turn  ? "turn"
-                                                            : "decode";
-        std::printf("%s: %s\n", file.c_str(), word);
-    }
-    return code;
 }
 
 } // namespace
@@ -67,8 +46,6 @@ int main(int argc, char** argv) {
         std::fputs(first == "--help" ? help.data() : "lumora-door " LUMORA_VERSION "\n", stdout);
         return allWell;
     }
-    if (first == "--needs" && arguments.size() > 1)
-        return tellNeeds({arguments.begin() + 1, arguments.end()});
     if (arguments.size() != 2 || first.starts_with("--")) {
         std::fputs("lumora-door: a source and a target are wanted; --help tells more\n", stderr);
         return notUnderstood;

@@ -1,15 +1,14 @@
 // Plays damaged files of all kinds through the door: each ends as a picture that is whole or as a failure, within the
-// limits, and leaves nothing else. door_damage [--count 1000] [--seed 1]
+// limits, and leaves nothing else. door_damage [--count 1000] [--seed 1] [--program PATH]
 
-#include "Corpus.h"
 #include "common/HostFile.h"
 #include "door/DoorDecoder.h"
 #include "imaging/files/JpegCheck.h"
+#include "samples/SamplePictureFiles.h"
 
 #include <QTemporaryDir>
 
 #include <cstdio>
-#include <cstdlib>
 #include <map>
 #include <random>
 #include <string>
@@ -21,7 +20,7 @@ namespace {
 
 QByteArray damaged(QByteArray bytes, std::mt19937& random) {
     const auto place = [&](qsizetype size) { return static_cast<qsizetype>(random() % static_cast<unsigned>(size)); };
-    for (unsigned left = 1 + random() % 8; left > 0 && bytes.size() > 1; --left) {
+    for (unsigned left = 1 + random() % 3; left > 0 && bytes.size() > 1; --left) {
         // Headers are short and decide much.
         const qsizetype at = place(random() % 2 == 0 ? std::min<qsizetype>(bytes.size(), 700) : bytes.size());
         switch (random() % 8) {
@@ -44,16 +43,17 @@ QByteArray damaged(QByteArray bytes, std::mt19937& random) {
 } // namespace
 
 int main(int argc, char** argv) {
-    std::map<std::string, int> options{{"--count", 1000}, {"--seed", 1}};
+    std::map<std::string, std::string> options{{"--count", "1000"}, {"--seed", "1"}, {"--program", LUMORA_DOOR}};
     for (int i = 1; i + 1 < argc; i += 2)
-        options[argv[i]] = std::atoi(argv[i + 1]);
-    std::mt19937 random(static_cast<unsigned>(options["--seed"]));
-    const auto files = corpus();
+        options[argv[i]] = argv[i + 1];
+    const int count = std::stoi(options["--count"]);
+    std::mt19937 random(static_cast<unsigned>(std::stoi(options["--seed"])));
+    const auto files = samplePictureFiles();
     const QTemporaryDir folder;
     const fs::path home = folder.path().toStdString();
-    const DoorDecoder decoder(LUMORA_DOOR, {10, qint64(1) << 30});
+    const DoorDecoder decoder(options["--program"], {10, qint64(1) << 30});
     std::map<std::string, int> ends;
-    for (int i = 0; i < options["--count"]; ++i) {
+    for (int i = 0; i < count; ++i) {
         const auto& [name, whole] = files[static_cast<std::size_t>(i) % files.size()];
         const QByteArray bytes = damaged(whole, random);
         fs::remove(home / "target.jpg");
@@ -65,13 +65,13 @@ int main(int argc, char** argv) {
         const auto left = std::distance(fs::directory_iterator(home), fs::directory_iterator());
         if (there != made.ok() || left != (there ? 2 : 1) || (decoded && !checkJpegDecodes(home / "target.jpg"))) {
             (void)writeWholeFile("door-fault-" + std::to_string(i), bytes);
-            std::printf("%s, variant %d of seed %d is a fault; door-fault-%d has it\n", name.c_str(), i,
-                        options["--seed"], i);
+            std::printf("%s, variant %d of seed %s is a fault; door-fault-%d has it\n", name.c_str(), i,
+                        options["--seed"].c_str(), i);
             return 1;
         }
         ++ends[made ? "made" : "refused, kind " + std::to_string(static_cast<int>(made.failure().kind))];
     }
-    for (const auto& [end, count] : ends)
-        std::printf("%s: %d\n", end.c_str(), count);
+    for (const auto& [end, times] : ends)
+        std::printf("%s: %d\n", end.c_str(), times);
     return 0;
 }

@@ -1,9 +1,9 @@
-#include "Corpus.h"
+#include "samples/SamplePictureFiles.h"
 
 #include <QBuffer>
 #include <QTransform>
 
-#include <cmath>
+#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -143,6 +143,23 @@ QByteArray pngWith(const QByteArray& png, const std::vector<std::pair<const char
     for (const auto& [name, content] : chunks)
         added += bigEndian({unsigned(content.size())}) + name + content + bigEndian({checkSum(name + content)});
     return png.left(behindSize) + added + png.mid(behindSize);
+}
+
+QByteArray webPWith(const QByteArray& webP, const QByteArray& exif, const QByteArray& profile) {
+    const auto number = [](qsizetype value, int size) {
+        QByteArray bytes;
+        for (int i = 0; i < size; ++i)
+            bytes += static_cast<char>(value >> 8 * i);
+        return bytes;
+    };
+    const auto chunk = [&number](const char* name, const QByteArray& content) {
+        return name + number(content.size(), 4) + content + QByteArray(content.size() % 2, '\0');
+    };
+    const QImage picture = QImage::fromData(webP);
+    const QByteArray chunks =
+        chunk("VP8X", number(0x28, 4) + number(picture.width() - 1, 3) + number(picture.height() - 1, 3)) +
+        chunk("ICCP", profile) + webP.mid(12) + chunk("EXIF", exif);
+    return "RIFF" + number(chunks.size() + 4, 4) + "WEBP" + chunks;
 }
 
 // Two frames, the second one of a black pixel. Codes of eight bits that are begun anew before they would need nine.
@@ -309,7 +326,7 @@ QByteArray inksProfile() {
     return bytesOf(profile);
 }
 
-std::vector<std::pair<std::string, QByteArray>> corpus() {
+std::vector<std::pair<std::string, QByteArray>> samplePictureFiles() {
     const QImage picture = patches(96, 64);
     QImage alpha = picture.convertToFormat(QImage::Format_ARGB32);
     alpha.setPixelColor(3, 3, QColor(10, 20, 30, 40));

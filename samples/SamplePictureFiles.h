@@ -1,7 +1,5 @@
 #pragma once
 
-#include "imaging/Bitmap.h"
-
 #include <QByteArray>
 #include <QImage>
 
@@ -26,6 +24,7 @@ QImage heldFor(const QImage& upright, int orientation);
 QByteArray exif(int orientation, bool adobeRgb = false, const QByteArray& small = {});
 QByteArray jpegWith(const QByteArray& jpeg, const QByteArray& exif, const QByteArray& profile = {}, int part = 60000);
 QByteArray pngWith(const QByteArray& png, const std::vector<std::pair<const char*, QByteArray>>& chunks);
+QByteArray webPWith(const QByteArray& webP, const QByteArray& exif, const QByteArray& profile);
 QByteArray bigEndian(std::initializer_list<unsigned> numbers);
 QByteArray gif(const QImage& picture);
 QByteArray inksJpeg(const QImage& picture, const QByteArray& profile);
@@ -48,7 +47,7 @@ QByteArray srgbProfile(const char* name);
 QByteArray greyProfile(double gamma);
 QByteArray inksProfile();
 
-// A few files of each kind by name, for damage.
-std::vector<std::pair<std::string, QByteArray>> corpus();
+// One or two files of each kind, by name.
+std::vector<std::pair<std::string, QByteArray>> samplePictureFiles();
 
 } // namespace lumora
