@@ -1,6 +1,6 @@
 #include "door/Confinement.h"
 
-#include <QByteArray>
+#include <QByteArrayList>
 
 #include <cerrno>
 #include <memory>
