@@ -375,19 +375,19 @@ TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
         {"reads a file", Kind::Damaged},
         {"opens the net", Kind::Damaged},
         {"begins a process", Kind::Damaged},
-        {"begins a program", Kind::Damaged},
         {"runs its own code", Kind::Damaged},
         {"says done", Kind::Damaged},
         {"says done of rubbish", Kind::Damaged},
         {"says done of half", Kind::Damaged},
     };
+    const QByteArray carrier = saved(patches(8, 6), "PNG") + saved(patches(8, 6), "JPG") + '\n';
+    EXPECT_TRUE(make(carrier + "behaves", decoder));
     for (const auto& [deed, kind] : cases) {
         SCOPED_TRACE(deed);
         if (!memoryIsLimited && deed == QLatin1String("eats memory"))
             continue;
-        expectRefused(saved(patches(8, 6), "PNG") + '\n' + deed, kind, decoder);
+        expectRefused(carrier + deed, kind, decoder);
     }
-    EXPECT_FALSE(fs::exists("/tmp/door-was-here"));
 }
 
 TEST_F(DoorTest, AFullDiskIsToldAndTheOldPictureStays) {
