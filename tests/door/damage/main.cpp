@@ -23,19 +23,15 @@ QByteArray damaged(QByteArray bytes, std::mt19937& random) {
     for (unsigned left = 1 + random() % 3; left > 0 && bytes.size() > 1; --left) {
         // Headers are short and decide much.
         const qsizetype at = place(random() % 2 == 0 ? std::min<qsizetype>(bytes.size(), 700) : bytes.size());
-        switch (random() % 8) {
-        case 0:
+        const unsigned way = random() % 8;
+        if (way == 0)
             bytes.truncate(at);
-            break;
-        case 1:
+        else if (way == 1)
             bytes.remove(at, 1 + place(64));
-            break;
-        case 2:
+        else if (way == 2)
             bytes.insert(at, bytes.mid(place(bytes.size()), 1 + place(64)));
-            break;
-        default:
+        else
             bytes[at] = static_cast<char>(random() % 4 == 0 ? 0xFF : random());
-        }
     }
     return bytes;
 }

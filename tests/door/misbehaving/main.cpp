@@ -21,44 +21,35 @@ namespace {
 
 volatile bool forEver = true;
 
-void write(std::string_view bytes) {
-    if (::write(doorTargetNumber, bytes.data(), bytes.size()) < 0)
-        _exit(1);
+void end(std::string_view bytes) {
+    _exit(::write(doorTargetNumber, bytes.data(), bytes.size()) < 0 ? 1 : 0);
+}
+
+void loop() {
+    while (forEver) {
+    }
+}
+
+void eat() {
+    for (std::vector<std::vector<char>> eaten; forEver;)
+        eaten.emplace_back(1 << 20, 'x');
 }
 
 const std::map<std::string, void (*)()> deeds{
     {"behaves", [] {}},
-    {"loops",
-     [] {
-         while (forEver) {
-         }
-     }},
+    {"loops", loop},
     {"waits", [] { std::binary_semaphore(0).acquire(); }},
-    {"eats memory",
-     [] {
-         std::vector<std::vector<char>> eaten;
-         while (forEver)
-             eaten.emplace_back(1 << 20, 'x');
-     }},
-    {"writes a file", [] { ::close(::open("/dev/null", O_WRONLY)); }},
-    {"reads a file", [] { ::close(::open("/etc/passwd", O_RDONLY)); }},
-    {"opens the net", [] { ::close(::socket(AF_INET, SOCK_STREAM, 0)); }},
-    {"begins a process",
-     [] {
-         if (::fork() == 0)
-             _exit(0);
-     }},
-    {"runs its own code", [] { ::mmap(nullptr, 4096, PROT_WRITE | PROT_EXEC, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0); }},
-    {"says done", [] { _exit(0); }},
-    {"says done of rubbish",
-     [] {
-         write("rubbish");
-         _exit(0);
-     }},
+    {"eats memory", eat},
+    {"writes a file", [] { (void)::open("/dev/null", O_WRONLY); }},
+    {"reads a file", [] { (void)::open("/etc/passwd", O_RDONLY); }},
+    {"opens the net", [] { (void)::socket(AF_INET, SOCK_STREAM, 0); }},
+    {"begins a process", [] { (void)::fork(); }},
+    {"runs its own code", [] { ::mmap(nullptr, 4096, PROT_EXEC, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0); }},
+    {"says done", [] { end({}); }},
+    {"says done of rubbish", [] { end("rubbish"); }},
     {"says done of half",
      [] {
-         write({"\xFF\xD8\xFF\xC0\0\x0B\x08\0\x08\0\x08\x01\x01\x11\0\xFF\xDA", 17});
-         _exit(0);
+         end({"\xFF\xD8\xFF\xC0\0\x0B\x08\0\x08\0\x08\x01\x01\x11\0\xFF\xDA", 17});
      }},
 };
 
@@ -72,10 +63,9 @@ int main(int argc, char** argv) {
         static_cast<std::size_t>(std::max<ssize_t>(0, ::pread(doorSourceNumber, source.data(), source.size(), 0))));
     if (!confineMyself())
         return 1;
-    const std::size_t end = source.rfind('\n');
-    deeds.at(source.substr(end + 1))();
+    const std::size_t name = source.rfind('\n');
+    deeds.at(source.substr(name + 1))();
     // Where it got away with that, it shows the picture that it carries.
     const std::size_t picture = source.find("\xFF\xD8\xFF");
-    write(std::string_view(source).substr(picture, end - picture));
-    _exit(0);
+    end(std::string_view(source).substr(picture, name - picture));
 }
