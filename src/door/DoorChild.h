@@ -25,7 +25,7 @@ enum class DoorStatus {
 // The whole main() of the child; arguments as of main(). Gives its status.
 int runDoorChild(int argc, char** argv);
 
-// The two limits of the arguments, set and taken; the sources of the tests' own children call it, too.
+// Sets the limits that the arguments tell; false where that can't be done.
 bool limitDoorChild(int argc, char** argv);
 
 } // namespace lumora
