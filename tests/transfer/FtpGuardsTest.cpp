@@ -365,6 +365,15 @@ TEST(FtpGuards, CarefullyNothingIsPutIntoTheFolderOfAnotherOrder) {
     }
 }
 
+TEST(FtpGuards, CarefullyNothingIsPutWhereTheOwnerOfAFolderIsNotKnown) {
+    Guarded order(true);
+    order.remote() = {{FtpFrmRig::first(), "another's"}};
+    order.lab.unreadLine = u"?"_s;
+    order.rig.send();
+    EXPECT_TRUE(order.lab.puts.isEmpty());
+    EXPECT_EQ(order.rig.page().phase(), SendingPhase::NotAll);
+}
+
 // Each put is answered well; what the server has stored is another matter.
 TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
     using Phase = OrderState::Phase;
@@ -397,6 +406,10 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
         order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::second()});
         order.rig.test.dialogs.answers = {true};
     };
+    const auto halfToldBySize = [=](Guarded& order) {
+        onFirst(1, half)(order);
+        order.lab.listsLengths = false;
+    };
     const auto halfUntold = [=](Guarded& order) {
         onFirst(1, half)(order);
         order.lab.listsLengths = order.lab.tellsSize = false;
@@ -422,6 +435,7 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
         {"cut in the first file, which is in hand", cutInTheFirst(true), Success, theFirstAndTheSharedName, true, false,
          Success},
         {"half of a file, once", onFirst(1, half), Success, 1, true, false, Success},
+        {"half of a file, once, and SIZE alone tells it", halfToldBySize, Success, 1, true, false, Success},
         {"the one CR of a picture is missing", oneCrMissing, Success, 1, true, false, Success},
         {"half of a file, and nothing tells lengths", halfUntold, Success, 0, true, true, Success},
         {"CR dropped", each([](QByteArray content) { return content.replace("\r", ""); }), CallLab, -4, false, false,
