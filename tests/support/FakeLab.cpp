@@ -71,6 +71,8 @@ public:
             m_cut = true;
             return Failure{fault.kind, remoteName};
         }
+        if (remoteName == m_lab.heldOpen && m_lab.folders[m_here].contains(remoteName))
+            return no(u"553 Could not create file."_s);
         const std::optional<QByteArray> stored =
             m_lab.stores ? m_lab.stores(remoteName, *content) : std::optional<QByteArray>(*content);
         if (stored)

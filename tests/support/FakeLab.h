@@ -33,6 +33,7 @@ public:
     QString hiddenFolder;              // no listing names it
     QString unreadLine;                // stands in each listing of an order's folder
     bool refusesDelete = false;
+    QString heldOpen;            // this name is taken again only once its file is deleted
     bool refusesFolders = false; // no folder can be made
     bool refusesEntry = false;   // the order's folder can't be entered
     bool listsDots = false;      // "." and ".." stand in each listing

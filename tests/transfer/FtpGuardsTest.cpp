@@ -406,6 +406,12 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
         order.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::second()});
         order.rig.test.dialogs.answers = {true};
     };
+    const auto partOfARest = [&](Guarded& order) {
+        part(order);
+        for (const QString& name : {FtpFrmRig::first(), FtpFrmRig::sheet()})
+            order.remote()[name] = order.rig.localFiles()[name];
+        order.keep({}, true);
+    };
     const auto halfToldBySize = [=](Guarded& order) {
         onFirst(1, half)(order);
         order.lab.listsLengths = false;
@@ -424,6 +430,7 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
             order.keep({}, true);
             for (const auto& [name, bytes] : order.rig.localFiles())
                 order.remote()[name] = name == FtpFrmRig::first() ? bytes.chopped(1) : bytes;
+            order.lab.heldOpen = FtpFrmRig::first();
             EXPECT_TRUE(!inHand || order.journal().take(FtpFrmRig::local(FtpFrmRig::first()).text()));
         };
     };
@@ -451,14 +458,13 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
              order.rig.test.dialogs.answers = {true};
          },
          AllThere, -1, true, false, Success, false, true},
-        {"a chosen part that makes the order whole",
+        {"a chosen part that makes the order whole", partOfARest, Success, -2, true, false, AllThere, true},
+        {"a chosen part, and a put of the rest was never confirmed",
          [&](Guarded& order) {
-             part(order);
-             for (const QString& name : {FtpFrmRig::first(), FtpFrmRig::sheet()})
-                 order.remote()[name] = order.rig.localFiles()[name];
-             order.keep({}, true);
+             partOfARest(order);
+             EXPECT_TRUE(order.journal().take(FtpFrmRig::local(FtpFrmRig::first()).text()));
          },
-         Success, -2, true, false, AllThere, true},
+         PartThere, -2, false, false, AllThere, true},
         {"a line of the listing can't be read", [](Guarded& order) { order.lab.unreadLine = u"?"_s; }, Unclear, 0,
          false, false, NotAll},
     };
@@ -474,7 +480,9 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
                 EXPECT_EQ(order.kept().phase == Phase::Reported, hasArrived(one.builtIn) && !one.chosenPart);
                 continue;
             }
-            EXPECT_EQ(order.kept().sentBefore, one.chosenPart && one.end == PartThere) << "not offered as unfinished";
+            EXPECT_EQ(order.kept().sentBefore,
+                      one.chosenPart && one.end == PartThere && order.kept().filesInHand.isEmpty())
+                << "not offered as unfinished";
             EXPECT_EQ(order.lab.puts.size(), FtpFrmRig::names().size() + one.putsMore);
             EXPECT_EQ(order.lab.urls.size(), one.reported ? 3 : 0);
             EXPECT_TRUE(one.end != Success || one.putsMore > 0 || order.rig.page().controls().Label34.text.isEmpty())
