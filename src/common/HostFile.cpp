@@ -161,11 +161,11 @@ Result<void> NewContent::commit(Durability durability) {
     m_temporary.clear();
     if (!synced)
         return {};
-    // The new name is not on the disk before its folder is; where a file system has no such call the file itself is
-    // still whole.
+    // The new name is not on the disk before its folder is. Not every file system can sync a folder, so that only a
+    // fault of the disk counts.
     const Descriptor folder(::open(m_target.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-    if (folder.valid())
-        ::fsync(folder.number());
+    if (folder.valid() && ::fsync(folder.number()) != 0 && (errno == EIO || errno == ENOSPC || errno == EDQUOT))
+        return systemFailure(errno, m_path);
     return {};
 }
 

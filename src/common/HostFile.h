@@ -57,7 +57,8 @@ public:
     void append(const char* bytes, std::size_t count);
     bool failed() const { return m_error != 0; }
 
-    // Syncs and renames. A passing file, which is of no use after a crash, need not wait for the disk.
+    // Syncs and renames. A passing file, which is of no use after a crash, need not wait for the disk. Where the
+    // folder's sync alone has failed, the new content stands under its name.
     enum class Durability { Synced, Passing };
     Result<void> commit(Durability durability = Durability::Synced);
 
