@@ -42,10 +42,15 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
     if (!m_folderThere)
         return {false, m_folderThere.failure()};
     const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));
-    const QString name = PrintFileName{line.code, line.index, static_cast<int>(m_state.Optint), base}.text();
-    const Result<void> written =
-        packed ? m_files.writeWhole(m_folder.filePath(name), *packed) : Result<void>(packed.failure());
-    return written ? Outcome{true, {}} : Outcome{false, written.failure()};
+    const DrivePath print =
+        m_folder.filePath(PrintFileName{line.code, line.index, static_cast<int>(m_state.Optint), base}.text());
+    const Result<void> written = packed ? m_files.writeWhole(print, *packed) : Result<void>(packed.failure());
+    if (written)
+        return {true, {}};
+    // What the log names as failed must not be sent.
+    if (m_files.fileExists(print))
+        static_cast<void>(m_files.removeFile(print));
+    return {false, written.failure()};
 }
 
 void PrintPacker::removeScratch() const {

@@ -110,8 +110,11 @@ void EditedPreparation::remakeThumbnail(int index, const BasketLine& line, const
         m_platform.files.read(m_folder->filePath(PrintNameOf(line, index, OrderKind::EditedPrint)));
     const Result<PrintFileContent> print =
         bytes ? readPrintFile(*bytes, PrintFileShape::of(m_state.profile)) : Result<PrintFileContent>(bytes.failure());
-    if (print && m_platform.files.writePassing(scratch, print->picture))
+    const Result<void> written = print ? m_platform.files.writePassing(scratch, print->picture) : print.failure();
+    if (written)
         saveThumbnail(line, scratch);
+    else if (print)
+        keep(written);
 }
 
 DrivePath EditedPreparation::thumbnailPath(const BasketLine& line) const {
@@ -135,8 +138,8 @@ void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& s
     NewContent thumbnail(*target, path.text());
     appendBmp(*preview, thumbnail, [] { return false; });
     // Without a thumbnail the picture's cell of the sheet stays empty.
-    if (thumbnail.commit(NewContent::Durability::Passing))
-        keep(kept().keepThumbnail(path));
+    const Result<void> saved = thumbnail.commit(NewContent::Durability::Passing);
+    keep(saved ? kept().keepThumbnail(path) : saved);
 }
 
 std::optional<Bitmap> EditedPreparation::drawSheet() {
