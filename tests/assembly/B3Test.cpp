@@ -5,14 +5,10 @@
 #include "order/OrderCheck.h"
 #include "order/OrderState.h"
 #include "support/JpegQuality.h"
-#include "support/SmallDisk.h"
 
 #include <QPainter>
 
-#include <csignal>
 #include <tuple>
-
-#include <sys/resource.h>
 
 namespace lumora {
 namespace {
@@ -252,39 +248,6 @@ TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLogAndCarefullyNotWithoutSheet
             state.MisparHazmana = u"105"_s;
         }
     }
-}
-
-// Where this user may not mount a disk, files that may not grow beyond a limit stand in for it.
-TEST_F(PreparingAnEditedOrder, losesNothingThatIsMadeWhenTheDiskRunsFull) {
-    const SmallDisk disk(1600);
-    QStringList items;
-    for (int i = 0; i < 8; ++i) {
-        const Bitmap picture =
-            noisyPicture(i % 2 == 0 ? 60 : 200, i % 2 == 0 ? 60 : 200, 5U + static_cast<unsigned>(i));
-        items += edited(giveFile(u"picture%1.jpg"_s.arg(i), *encodeJpeg(picture, 90)),
-                        record(i % 2 == 0 ? Changes() : toned));
-    }
-    rlimit before{};
-    ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &before), 0);
-    std::filesystem::remove_all(host(u"C:\\2000lumora"_s));
-    std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\2000lumora"_s));
-    makeFolder(u"C:\\2000lumora\\zmany"_s);
-    if (!disk.available()) {
-        std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{300'000, before.rlim_max}; // between the two sizes of the prints
-        ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limit), 0);
-    }
-    const QStringList failed = prepare(items);
-    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &before), 0);
-    ASSERT_FALSE(machine.dialogs.messages.isEmpty());
-    EXPECT_TRUE(machine.dialogs.messages[0].contains(u"2000lumora"_s)) << machine.dialogs.messages[0].toStdString();
-    const QStringList made = printFiles();
-    EXPECT_FALSE(made.isEmpty());
-    EXPECT_LT(made.size(), items.size());
-    EXPECT_EQ(made.size() + failed.size(), items.size()) << "each picture is printed or named as failed";
-    for (const QString& name : made)
-        EXPECT_TRUE(unpacked(name)) << name.toStdString();
-    EXPECT_EQ(machine.files.names(u"C:\\pics"_path, u"*"_s).size(), items.size());
 }
 
 } // namespace

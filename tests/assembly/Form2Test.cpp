@@ -248,31 +248,6 @@ TEST_F(PreparingAPlainOrder, goesToTheFinishedOrdersWhereTheLabHasTheExtraStep) 
     EXPECT_EQ(state.handOver.lines, QStringList(state.transfer.OrderLogBase.text()));
 }
 
-TEST_F(PreparingAPlainOrder, goesOnWithoutAPrintAndTheCounterButNotWithoutTheLog) {
-    const QString one = givePicture(u"one.jpg"_s);
-    const DrivePath print = folder() / u"1 1015GNB0000_016F6E65.jpp";
-    makeFolder(u"C:\\vedron\\mispar.txt"_s);
-    Form2& page = openWith({line(one), line(givePicture(u"two.jpg"_s))});
-    onceClaimed([&] {
-        makeFolder(print);
-        makeFolder(logPath());
-    });
-    page.Command6_Click();
-    EXPECT_EQ(page.controls().List4fail.items(), QStringList(one));
-    ASSERT_EQ(machine.dialogs.messages.size(), 3);
-    for (const auto& [i, about] : {std::pair(0, print.leaf()), {1, u"mispar.txt"_s}, {2, u"KUP_1234^105.txt"_s}})
-        EXPECT_TRUE(machine.dialogs.messages[i].contains(about)) << qPrintable(machine.dialogs.messages[i]);
-    EXPECT_EQ(front(), PageId::Form2);
-    EXPECT_EQ(printFiles().size(), 1) << "what was prepared is kept";
-
-    std::filesystem::remove(host(logPath()));
-    std::filesystem::remove(host(print));
-    page.Command3_Click();
-    EXPECT_EQ(front(), PageId::FtpFrm);
-    EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the same number at the next press";
-    EXPECT_EQ(printFiles().size(), 2);
-}
-
 class PreparingAnAlbum : public PreparingAPlainOrder {
 protected:
     PreparingAnAlbum() {

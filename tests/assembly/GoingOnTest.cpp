@@ -45,12 +45,6 @@ protected:
         return found.first();
     }
 
-    QMap<QString, QByteArray> content() const {
-        QMap<QString, QByteArray> bytes;
-        for (const QString& name : machine.files.names(folder(), u"*"_s))
-            bytes[name] = read(folder() / name);
-        return bytes;
-    }
     OrderState stored() const { return *ReadOrderState(machine.files, OrderFolder(folder())); }
 
     QMap<QString, QByteArray> undisturbed;

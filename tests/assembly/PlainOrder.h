@@ -6,6 +6,8 @@
 #include "support/ExampleOrder.h"
 #include "support/PageRig.h"
 
+#include <QMap>
+
 #include <gtest/gtest.h>
 
 namespace lumora {
@@ -75,6 +77,13 @@ protected:
         QStringList names = machine.files.names(folder(number), u"*.jpp"_s);
         names.removeIf([](const QString& name) { return name.startsWith(u'!'); });
         return names;
+    }
+    // The files of the order's folder.
+    QMap<QString, QByteArray> content() const {
+        QMap<QString, QByteArray> bytes;
+        for (const QString& name : machine.files.names(folder(), u"*"_s))
+            bytes[name] = read(folder() / name);
+        return bytes;
     }
     // The picture inside a print file.
     Result<PrintFileContent> unpacked(const QString& name, const QString& number = u"105"_s) const {

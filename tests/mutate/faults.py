@@ -10,13 +10,13 @@ F = collections.namedtuple('F', 'old new harm seen told', defaults=(False, ''))
 
 # What a floor's faults are played against: the tests of the floor, then further ones, the quick ones first.
 SUITES = {
-    'common': ('common', 'order', 'session', 'platform', 'finished', 'assembly', 'scenarios'),
+    'common': ('common', 'order', 'session', 'platform', 'finished', 'assembly', 'torture', 'scenarios'),
     'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
     'platform': ('platform', 'session', 'order', 'finished', 'integration_mail', 'transfer', 'internet', 'scenarios'),
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
     'editing': ('editing', 'selection', 'assembly', 'scenarios', 'views'), 'selection': ('selection', 'scenarios', 'views'),
-    'assembly': ('assembly', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios'),
+    'assembly': ('assembly', 'torture', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios'),
     'finished': ('finished', 'integration_mail', 'scenarios', 'views'), 'entry': ('entry', 'scenarios', 'views'),
     'start': ('start', 'scenarios', 'views'), 'views': ('views', 'drive'), 'app': ('drive', 'scenarios', 'views')}
 
