@@ -217,38 +217,5 @@ TEST_F(PreparingAnEditedOrder, savesSheetTailAndWayAsTheirReceiverWantsThem) {
     }
 }
 
-TEST_F(PreparingAnEditedOrder, isNotSentWithoutItsLogAndCarefullyNotWithoutSheetOrPrintsAsAPlainOneToo) {
-    const QString good = givePicture(u"one_1.jpg"_s), bad = giveFile(u"bad_1.jpg"_s, "no picture");
-    const struct {
-        bool careful;
-        DrivePath blocked;
-        QString picture;
-        bool isSent;
-    } cases[] = {{false, logPath(), good, false},
-                 {false, folder() / u"!105_1234.jpp", good, true},
-                 {true, folder() / u"!105_1234.jpp", good, false},
-                 {false, {}, bad, true},
-                 {true, {}, bad, false},
-                 {true, {}, good, true}};
-    for (const bool edits : {true, false}) {
-        for (const auto& c : cases) {
-            SCOPED_TRACE(&c - cases);
-            state.Careful = c.careful;
-            PreparationPage& page = openEither(edits, {edits ? edited(c.picture) : line(c.picture)});
-            onceClaimed([&] {
-                if (!c.blocked.isEmpty())
-                    makeFolder(c.blocked);
-            });
-            start(page);
-            EXPECT_EQ(front(), c.isSent ? PageId::FtpFrm : edits ? PageId::B3 : PageId::Form2);
-            const bool begun = edits || c.isSent || c.blocked == logPath(); // a plain order's sheet comes first
-            EXPECT_EQ(printFiles().size(), c.picture == good && begun ? 1 : 0);
-            chain.unload(front());
-            std::filesystem::remove_all(host(folder()));
-            state.MisparHazmana = u"105"_s;
-        }
-    }
-}
-
 } // namespace
 } // namespace lumora

@@ -1,6 +1,7 @@
 #include "EditedOrder.h"
 
 #include "order/UnfinishedOrders.h"
+#include "support/Take.h"
 
 namespace lumora {
 namespace {
@@ -45,7 +46,7 @@ protected:
         return found.first();
     }
 
-    OrderState stored() const { return *ReadOrderState(machine.files, OrderFolder(folder())); }
+    OrderState stored() const { return take(ReadOrderState(machine.files, OrderFolder(folder()))); }
 
     QMap<QString, QByteArray> undisturbed;
 };

@@ -57,16 +57,6 @@ protected:
         return *dynamic_cast<Form2*>(chain.find(PageId::Form2));
     }
 
-    // Does this at the first yield at which the order has its folder.
-    void onceClaimed(const std::function<void()>& what) {
-        machine.pump.onPump = [this, what, done = false]() mutable {
-            if (done || !machine.files.folderExists(folder()))
-                return;
-            done = true;
-            what();
-        };
-    }
-
     DrivePath folder(const QString& number = u"105"_s) const {
         return u"C:\\2000lumora\\!!000"_path / (u"2026_11_21_KUP_1234^"_s + number);
     }

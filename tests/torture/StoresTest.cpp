@@ -35,7 +35,7 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
     const struct {
         DrivePath path;
         std::function<Result<void>()> write;
-        bool synced = true;
+        int syncedFiles = 1;
     } stores[] = {
         {WorkspacePaths::counter(state), [&] { return Workspace(state, files).writeCounter(); }},
         {root / u"pratim.txt",
@@ -46,18 +46,19 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
          [&] {
              return details.SaveAlbumDetails({u"Dana"_s, u"03"_s, u"d"_s});
          }},
-        {root / u"Tik4txt\\all_list.txt", [&] { return writeHandOverFiles(state, files, {u"a"_s}, 0); }, false},
+        {root / u"Tik4txt\\all_list.txt", [&] { return writeHandOverFiles(state, files, {u"a"_s}, 0); }, 0},
         {StoredSmallView::path(state, picture),
          [&] { return StoredSmallView::store(state, files, picture, Bitmap(9, 9, Qt::red)); }},
         {order.statePath(), [&] { return WriteOrderState(files, order, {}); }},
         {order.brokenFilesPath(), [&] { return WriteBrokenFiles(files, order, broken); }},
         {picture, [&] { return saveJpeg(Bitmap(9, 9, Qt::red), host(picture), 90); }},
         {root / u"copy", [&] { return files.copyFile(piece, root / u"copy"); }},
-        {root / u"b_jpp_001_001.prk",
+        {root / u"b_jpp_003_003.prk",
          [&] {
              const auto here = Mod4split::Target::FolderOfSource;
-             return failureOf(pieces.SplitFile(root / u"b.jpp", u"99"_s, here, u"jpp"_s));
-         }},
+             return failureOf(pieces.SplitFile(root / u"b.jpp", u"5"_s, here, u"jpp"_s));
+         },
+         3},
         {root / u"moorkavim\\a.jpp", [&] { return failureOf(pieces.MergeFamily(piece)); }},
     };
     for (const auto& store : stores) {
@@ -72,9 +73,10 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
             failed = call == 0 || fault.met();
             const QByteArray now = read(store.path);
             EXPECT_EQ(written.ok(), call == 0 || !failed);
+            EXPECT_TRUE(written.ok() || (written.failure().kind == Failure::Kind::NoSpace) == (call % 2 == 1));
             if (call == 0) {
                 after = now;
-                EXPECT_EQ(fault.syncs(), store.synced ? 2 : 0) << "file and folder";
+                EXPECT_EQ(fault.syncs(), 2 * store.syncedFiles) << "file and folder";
             }
             EXPECT_TRUE(now == after || (!written.ok() && now == "7\r\n")) << now.toStdString();
             EXPECT_EQ(removeLeftovers(host(u"C:\\"_s), std::filesystem::file_time_type::max()), 0);
