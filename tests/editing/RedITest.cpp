@@ -62,7 +62,7 @@ protected:
         state.edit.PicturePath = u"C:\\pics\\eyes.jpg"_path;
         ASSERT_TRUE(picture.image().save(toText(host(state.edit.PicturePath)), "PNG"));
         original = picture.image();
-        customersFile = *machine.files.read(state.edit.PicturePath);
+        customersFile = read(state.edit.PicturePath);
     }
 
     RedI& open() {
@@ -180,9 +180,9 @@ TEST_F(RedEyePage, AcceptsIntoAFileOfItsOwn) {
     EXPECT_FALSE(isOpen());
     EXPECT_EQ(redMarker(), u"RED"_s);
     EXPECT_TRUE(machine.files.folderExists(u"C:\\2000lumora\\zmany\\job_folder\\red_folder"_path));
-    EXPECT_EQ(machine.files.read(correctedCopy)->left(2), "BM");
+    EXPECT_EQ(read(correctedCopy).left(2), "BM");
     EXPECT_EQ(pictureIn(correctedCopy), corrected);
-    EXPECT_EQ(*machine.files.read(state.edit.PicturePath), customersFile);
+    EXPECT_EQ(read(state.edit.PicturePath), customersFile);
 }
 
 TEST_F(RedEyePage, CarefullyGoesOnFromTheCorrectionAndGivesItUpByRestoring) {
@@ -254,12 +254,12 @@ TEST_F(RedEyePage, KeepsThePictureBeforeTheLatestCorrectionAsItsUndoCopy) {
 TEST_F(RedEyePage, NeverTakesBackToTheCopyOfAnotherVisit) {
     std::filesystem::create_directories(host(undoCopy).parent_path());
     ASSERT_TRUE(QImage(200, 150, QImage::Format_RGB32).save(toText(host(undoCopy)), "BMP"));
-    const QByteArray others = *machine.files.read(undoCopy);
+    const QByteArray others = read(undoCopy);
     RedI& page = open();
     EXPECT_FALSE(page.controls().Image7.enabled);
     page.Image7_Click();
     EXPECT_EQ(image(page), original);
-    EXPECT_EQ(*machine.files.read(undoCopy), others);
+    EXPECT_EQ(read(undoCopy), others);
 }
 
 TEST_F(RedEyePage, DoesNotCorrectWhatItCouldNotTakeBack) {

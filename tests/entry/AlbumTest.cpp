@@ -216,7 +216,7 @@ TEST_F(AlbumTest, ThePhotographerIsRememberedWhenAskedTo) {
     first.Command4_Click();
     first.album().Check5_Click(true);
     first.album().Command17_Click();
-    EXPECT_EQ(*machine.files.read(photographerStore), "0\r\n\" Studio Or \"\r\n\"03-7654321\"\r\n\"studio\"\r\n0\r\n");
+    EXPECT_EQ(read(photographerStore), "0\r\n\" Studio Or \"\r\n\"03-7654321\"\r\n\"studio\"\r\n0\r\n");
     chain.unload(PageId::nnn);
 
     AlbumPanels& second = start().album();

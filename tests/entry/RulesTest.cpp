@@ -6,6 +6,7 @@
 #include "common/FixedText.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -88,7 +89,7 @@ protected:
 TEST_F(DetailStoreTest, KeepsNameAndTelephoneInFiveLines) {
     EXPECT_FALSE(*store.details());
     ASSERT_TRUE(store.SaveDetails({u"דנה \"לוי"_s, u"03-1"_s}).ok());
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim.txt"_path),
+    EXPECT_EQ(take(machine.files.read(u"C:\\2000lumora\\pratim.txt"_path)),
               "0\r\n\"\xE3\xF0\xE4 \"\xEC\xE5\xE9\"\r\n\"03-1\"\r\n0\r\n0\r\n");
     EXPECT_EQ((**store.details()).name, u"דנה \"לוי");
     for (int again = 0; again < 2; ++again)
@@ -122,7 +123,7 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
 
 TEST_F(DetailStoreTest, AnAlbumFieldThatIsMissingMovesTheOthersUp) {
     ASSERT_TRUE(store.SaveAlbumDetails({u"Studio"_s, QString(), u"x"_s}).ok());
-    EXPECT_EQ(*machine.files.read(u"C:\\2000lumora\\pratim2.txt"_path), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
+    EXPECT_EQ(take(machine.files.read(u"C:\\2000lumora\\pratim2.txt"_path)), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
     const auto read = store.albumDetails();
     ASSERT_TRUE(read.ok() && *read);
     EXPECT_EQ((*read)->name, u"Studio");

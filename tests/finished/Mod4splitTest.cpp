@@ -2,7 +2,6 @@
 
 #include "order/PieceName.h"
 #include "support/PageRig.h"
-#include "support/SmallDisk.h"
 
 #include <gtest/gtest.h>
 
@@ -161,41 +160,6 @@ TEST_F(Mod4splitTest, WhatCanNotBeJoinedIsRefusedAndLeavesNoFolder) {
     // Fewer than 4 characters before the tail leave the base empty.
     write(u"C:\\order\\jpp_001_001.prk"_path, "x");
     EXPECT_EQ(pieces.MergeFamily(u"C:\\order\\jpp_001_001.prk"_path).file, u"C:\\order\\moorkavim\\.jpp"_path);
-}
-
-TEST_F(Mod4splitTest, AFullDiskLeavesWholePiecesAndTheOldJoinedFile) {
-    const SmallDisk disk(64);
-    if (!disk.available())
-        GTEST_SKIP() << "no right to mount a disk";
-    std::filesystem::create_directory_symlink(disk.path(), host(u"C:\\small"_path));
-    const DrivePath small = u"C:\\small\\02a.jpp"_path;
-    const QByteArray bytes = bytesOf(40000);
-    write(small, bytes);
-    const DrivePath older = u"C:\\small\\moorkavim\\02a.jpp"_path;
-    makeFolder(u"C:\\small\\moorkavim"_path);
-    write(older, "the older one");
-    const auto leaves = [&] {
-        QStringList names;
-        for (const auto& entry : std::filesystem::recursive_directory_iterator(disk.path())) {
-            if (entry.is_regular_file())
-                names += toText(entry.path().filename());
-        }
-        names.sort();
-        return names;
-    };
-    const Cut made = pieces.SplitFile(small, u"8000"_s, Mod4split::Target::FolderOfSource, u"jpp"_s);
-    ASSERT_TRUE(made.failure);
-    EXPECT_EQ(made.failure->kind, Failure::Kind::NoSpace);
-    EXPECT_EQ(made.pieces, 2);
-    EXPECT_EQ(leaves(), (QStringList{u"02a.jpp"_s, u"02a.jpp"_s, u"02a_jpp_001_006.prk"_s, u"02a_jpp_002_006.prk"_s}));
-    EXPECT_EQ(read(small), bytes);
-
-    const Joined joined = pieces.MergeFamily(u"C:\\small\\02a_jpp_001_006.prk"_path);
-    ASSERT_TRUE(joined.failure);
-    EXPECT_EQ(joined.failure->kind, Failure::Kind::NoSpace);
-    EXPECT_EQ(leaves().size(), 4) << "no half file:" << leaves().join(u' ').toStdString();
-    EXPECT_EQ(read(older), "the older one");
-    EXPECT_EQ(read(u"C:\\small\\02a_jpp_001_006.prk"_path), bytes.left(8000));
 }
 
 TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {

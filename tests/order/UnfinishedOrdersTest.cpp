@@ -5,6 +5,7 @@
 #include "order/OrderLog.h"
 #include "session/Workspace.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -195,7 +196,7 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
         SessionState sending;
         sending.transfer.SugMishloah = Sending::Resend;
         sending.transfer.leftOut = {{u"C:\\of another order.jpg"_path}};
-        EXPECT_EQ(TakeUpOrder({folder, *ReadOrderState(test.files, folder)}, sending, test.files),
+        EXPECT_EQ(TakeUpOrder({folder, take(ReadOrderState(test.files, folder))}, sending, test.files),
                   way == Way::Http ? Outcome::SendingTakenUpByHttp : Outcome::SendingTakenUpByFtp);
         EXPECT_EQ(sending.transfer.OrderFolder, folder.path());
         EXPECT_EQ(sending.transfer.ShemTikiya, name + u'P');

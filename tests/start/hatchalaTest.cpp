@@ -3,6 +3,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -257,7 +258,7 @@ TEST_F(hatchalaTest, TheServicePanelWritesFetchesAndReadsTheSettings) {
     page.Command5_Click();
     EXPECT_EQ(page.controls().List4pices.count(), 21);
     const DrivePath path = u"C:\\2000lumora\\tarvelmond.txt"_path;
-    EXPECT_EQ(machine.files.read(path)->size(), 203);
+    EXPECT_EQ(take(machine.files.read(path)).size(), 203);
     page.Command3_Click();
     EXPECT_EQ(machine.dialogs.messages, QStringList({"No Server", "No Server 2"}));
     EXPECT_FALSE(machine.files.fileExists(path)) << "the old copy goes before the fetch";

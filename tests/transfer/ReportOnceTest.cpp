@@ -2,6 +2,7 @@
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 #include "transfer/delivery/Attempts.h"
 
@@ -42,7 +43,7 @@ struct AReport : ::testing::Test {
         state.shemot.n3 = u"***"_s;
         EXPECT_TRUE(test.files.makeFolder(u"C:\\orders"_path) && test.files.makeFolder(folder.path()));
     }
-    OrderState kept() const { return ReadOrderState(test.files, folder).value(); }
+    OrderState kept() const { return take(ReadOrderState(test.files, folder)); }
 
     TestPlatform test;
     SessionState state = exampleOrder();

@@ -2,6 +2,7 @@
 #include "order/OrderLog.h"
 #include "support/FakeWebLab.h"
 #include "support/RecordedSending.h"
+#include "support/Take.h"
 #include "support/UploadFormRig.h"
 
 #include <gtest/gtest.h>
@@ -122,13 +123,13 @@ TEST_F(UploadFormTest, AFileThatADeadProgramHadInHandIsSentAgainAndTheListOfBrok
             other.uploads[UploadFormRig::name()] = sent;
             other.uploads[UploadFormRig::name()][UploadFormRig::first()].chop(5);
             OrderState meanwhile;
-            other.onPost = [&](const QString&) { meanwhile = ReadOrderState(dead.test.files, order).value(); };
+            other.onPost = [&](const QString&) { meanwhile = take(ReadOrderState(dead.test.files, order)); };
             EXPECT_EQ(dead.send().phase(), SendingPhase::Success);
             EXPECT_EQ(other.posted, QStringList(1 + refused, UploadFormRig::first()));
             EXPECT_EQ(meanwhile.filesInHand, QStringList(path));
             EXPECT_EQ(meanwhile.phase, OrderState::Phase::Sending);
             EXPECT_EQ(other.uploads[UploadFormRig::name()], sent);
-            const OrderState after = ReadOrderState(dead.test.files, order).value();
+            const OrderState after = take(ReadOrderState(dead.test.files, order));
             EXPECT_TRUE(after.filesInHand.isEmpty());
             EXPECT_EQ(after.phase, OrderState::Phase::Reported);
         }
