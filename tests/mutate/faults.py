@@ -367,7 +367,8 @@ FAULTS = {
           'a part that was never confirmed counts as arrived')],
     'src/transfer/ftp/UploadPass.cpp': [
         F('m_session.remove(name);', '', 'a server keeps the cut file'),
-        F('m_skipped += *length;', '', 'a long order that is mostly there is given up as too slow'),
+        F('m_skipped += *length;', '', 'a long order that is mostly there is given up as too slow',
+          told='what lies there is passed over in moments; the limit counts five minutes'),
         F('m_inHand.contains(path) && m_session.isWhole(path)', 'm_inHand.contains(path)', 'a part counts as whole when the sending goes on')],
     'src/transfer/ftp/FtpSender.cpp': [
         F('check.NumOnServer == NumToSend && !check.unreadable', 'check.NumOnServer == NumToSend', 'a count of an unreadable listing is believed'),

@@ -3,6 +3,7 @@
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
 #include "support/FtpFrmRig.h"
+#include "transfer/delivery/PreparedAgain.h"
 #include "transfer/delivery/SilenceLimit.h"
 
 #include <gtest/gtest.h>
@@ -374,6 +375,17 @@ TEST(FtpGuards, CarefullyNothingIsPutWhereTheOwnerOfAFolderIsNotKnown) {
     EXPECT_EQ(order.rig.page().phase(), SendingPhase::NotAll);
 }
 
+TEST(FtpGuards, AnOrderThatFindsNoOtherNumberLeavesTheSessionAsItWas) {
+    Guarded order(true);
+    order.keep({u"021015GNBC:\\pics\\aabb.jpg"_s}, false);
+    SessionState& state = order.rig.state;
+    state.Optint = OrderKind::Album;
+    PreparedAgain again(state, order.rig.test.platform, order.journal());
+    EXPECT_FALSE(again.handOver([](const QString&) { return std::optional<bool>(); }));
+    EXPECT_EQ(state.Optint, OrderKind::Album);
+    EXPECT_EQ(state.MisparHazmana, u"105");
+}
+
 // Each put is answered well; what the server has stored is another matter.
 TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
     using Phase = OrderState::Phase;
@@ -485,6 +497,7 @@ TEST(FtpGuards, CarefullyAnOrderHasArrivedWhenEachNameAndEachLengthIsThere) {
                 << "not offered as unfinished";
             EXPECT_EQ(order.lab.puts.size(), FtpFrmRig::names().size() + one.putsMore);
             EXPECT_EQ(order.lab.urls.size(), one.reported ? 3 : 0);
+            EXPECT_TRUE(!one.reported || order.lab.urls[0] == order.rig.state.profile.ReportUrl + u"c.txt"_s);
             EXPECT_TRUE(one.end != Success || one.putsMore > 0 || order.rig.page().controls().Label34.text.isEmpty())
                 << "the first attempt alone";
             EXPECT_EQ(order.kept().phase == Phase::Reported, one.reported);

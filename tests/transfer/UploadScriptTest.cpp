@@ -1,6 +1,8 @@
 #include "transfer/http/UploadScript.h"
+#include "session/SessionState.h"
 #include "support/FakeWebLab.h"
 #include "support/TestPlatform.h"
+#include "transfer/http/HttpListGuard.h"
 #include "transfer/http/ServerList.h"
 
 #include <gtest/gtest.h>
@@ -101,12 +103,18 @@ TEST(ServerListTest, AnEntryStrikesOneNameThatContainsItOrCarefullyIsIt) {
         {{u"."_s, u"jpp"_s, u"txt"_s}, {small}, {log, large, small}},
         {{u"..\\..\\x"_s, u"C:\\o\\1.jpp"_s}, {log, large, small}, {log, large, small}},
     };
-    for (const auto& c : cases) {
-        const QStringList files = {log, large, small};
-        EXPECT_EQ(MarkHossarim(files, c.entries, folder), c.left) << c.entries.join(u'|').toStdString();
-        EXPECT_EQ(MarkHossarim(files, c.entries, folder, ListMatch::Whole), c.leftByWholeNames)
-            << c.entries.join(u'|').toStdString();
+    SessionState state;
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        for (const auto& c : cases)
+            EXPECT_EQ(MarkHossarim({log, large, small}, c.entries, folder, HttpListGuard(state).match()),
+                      careful ? c.leftByWholeNames : c.left)
+                << c.entries.join(u'|').toStdString();
     }
+}
+
+TEST(NameInAddress, KeepsTheSignsThatWouldEndAnAddress) {
+    EXPECT_EQ(NameInAddress(u"a#b?c%d.jpp"_s), u"a%23b%3Fc%25d.jpp"_s);
 }
 
 TEST(ServerListTest, AListMustNameTheFolderAndATotalAndNoWhereSayNot) {
