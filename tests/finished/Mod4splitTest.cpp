@@ -188,6 +188,7 @@ TEST(PieceFamilies, AreToldByTheNumbersInTheirNames) {
         ListSingles(found, families);
         ASSERT_FALSE(families.isEmpty());
         EXPECT_EQ(families.item(0), found.item(0));
+        EXPECT_FALSE(families.contains(found.items().last()));
         families.setCurrentIndex(0);
         TextList family;
         family.append(u"from before"_s);

@@ -364,6 +364,15 @@ TEST_F(FinishedOrders, AStoppedWalkGoesOnWithWhatIsUnsentWhereTheLabIsCareful) {
     const QStringList basket(3, u"1 1015GNBC:\\pics\\one.jpg"_s);
     PageRig::write(folder.logPath(),
                    OrderLog::of(state, OrderLog::Layout::Plain, basket, {}, machine.clock.time).write());
+    MoogMeret& part = startWith(order);
+    part.File1_Click(part.controls().File1.find(prints[0]));
+    machine.clock.time = at("10:00:00");
+    part.Command2_Click();
+    for (int minute = 3; part.phase() == MoogMeret::Phase::Walking; minute += 3)
+        tick(u"10:%1:00"_s.arg(minute, 2, 10, QChar(u'0')).toLatin1().constData());
+    EXPECT_TRUE(part.walk().allSent());
+    EXPECT_FALSE(ReadOrderState(machine.files, folder)) << "a part is not the order";
+    chain.unload(PageId::MoogMeret);
     for (const bool careful : {false, true}) {
         state.Careful = careful;
         machine.mail.messages.clear();
@@ -417,6 +426,7 @@ TEST_F(FinishedOrders, ThePackagesGoByMailAsTheyAreSelected) {
     EXPECT_EQ(walk(), "over");
     ASSERT_EQ(machine.mail.messages.size(), 3);
     EXPECT_EQ(page.walk().fate(1), PackageWalk::Fate::Failed);
+    EXPECT_EQ(page.walk().nextUnsent(-1), 1);
     EXPECT_TRUE(page.controls().Label4Sof.text.startsWith(u"נשלחו 2 מתוך 3"));
     EXPECT_TRUE(machine.files.fileExists(DrivePath(in(whole, u"02a.jpp"_s))));
 
