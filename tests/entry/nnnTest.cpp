@@ -32,7 +32,6 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     nnn& page = start();
     const nnnControls& shown = page.controls();
     EXPECT_EQ(state.shemot.Girsa, u"4.00");
-    EXPECT_TRUE(shown.Image1[6].visible && !shown.Image1[3].visible);
     state.transfer.HazmanaP = 1;
     state.transfer.Mefurak = Travel::Pieces;
     page.Image1_Click(0);
@@ -148,11 +147,6 @@ TEST_F(nnnTest, ATileForgetsTheChoicesOfTheOrderBefore) {
     page.Check1_Click(true);
     page.Command3_Click();
     EXPECT_EQ(page.step(), nnn::Step::Options) << "no size yet";
-    EXPECT_FALSE(shown.Command8.enabled);
-    page.Option1_Click(0);
-    EXPECT_TRUE(shown.Command8.enabled);
-    page.Command8_Click();
-    EXPECT_EQ(page.step(), nnn::Step::Border);
 }
 
 TEST_F(nnnTest, ChecksTheDetailsBeforeTheOptions) {
@@ -361,19 +355,6 @@ TEST_F(nnnTest, ACouponSetsTheLimitOfTheSizeThatIsTaken) {
         next.Image1_Click(0);
         EXPECT_EQ(state.coupon.MisparKoopon, careful ? 0 : 220) << "of an earlier customer";
     }
-}
-
-TEST_F(nnnTest, TheQuickCheckNeedsANameAlone) {
-    nnn& page = start();
-    page.Image1_Click(1);
-    page.QuickCheck();
-    EXPECT_EQ(machine.dialogs.messages.size(), 1);
-    page.Text2_Change(u" Dana "_s);
-    page.QuickCheck();
-    EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
-    const OrderDetails& details = state.shemot;
-    EXPECT_EQ(QStringList({details.n1, details.n2, details.ppr, details.maat, details.Bord, details.FillFit}),
-              QStringList({"Dana", "Dana", "10/15", "מבריק", "NB", "FIT"}));
 }
 
 } // namespace

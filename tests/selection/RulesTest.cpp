@@ -59,15 +59,6 @@ TEST(ABasket, stopsItsSearchAtALineThatIsTooShort) {
     EXPECT_EQ(basket.FindByPath(u"C:\\b.jpg"_s), 1);
 }
 
-TEST(ABasket, dropsLaterLinesThatDifferInTheirCopiesOnly) {
-    Basket basket;
-    for (const auto& [copies, name] : {std::pair{5, "a"}, {2, "b"}, {9, "a"}, {1, "a"}})
-        basket.append(plainLine(copies, u"C:\\%1.jpg"_s.arg(QLatin1String(name))));
-    basket.removeDuplicates();
-    EXPECT_EQ(basket.lines().items(), QStringList({plainLine(5, u"C:\\a.jpg"_s), plainLine(2, u"C:\\b.jpg"_s)}));
-    EXPECT_EQ(basket.SumCopies(), 7);
-}
-
 QStringList names(int count) {
     QStringList list;
     for (int i = 1; i <= count; ++i)
@@ -224,8 +215,6 @@ TEST(APrintGrade, goesByThePixelCountAlone) {
         EXPECT_EQ(printGrade(c.size), c.grade);
         EXPECT_EQ(printGradeText(c.grade, c.size, false), c.text);
     }
-    EXPECT_EQ(largeViewSize({1000, 1000}), (PictureSize{300, 300}));
-    EXPECT_EQ(largeViewSize({3000, 4000}), (PictureSize{300, 400}));
 }
 
 } // namespace
