@@ -29,7 +29,6 @@ public:
     static QString user() { return u"ftp"_s; }
     static QString password() { return u"loopback-lab"_s; }
 
-    quint16 httpPort() const { return m_httpPort; }
     // "http://127.0.0.1:PORT", without a slash at its end.
     QString site() const { return u"http://127.0.0.1:%1"_s.arg(m_httpPort); }
 

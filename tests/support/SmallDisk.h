@@ -10,8 +10,8 @@
 
 namespace lumora {
 
-// A disk of so many kilobytes, mounted on a temporary folder while this lives, or one that can only be read. Mounting
-// needs root: a test asks available() first and is skipped for an ordinary user.
+// A disk of so many kilobytes, mounted on a temporary folder while this lives. Mounting needs root: a test asks
+// available() first and is skipped for an ordinary user.
 class SmallDisk {
 public:
     explicit SmallDisk(int kilobytes) {
@@ -27,9 +27,6 @@ public:
 
     bool available() const { return m_mounted; }
     HostPath path() const { return toHostPath(m_folder.path()); }
-    bool makeReadOnly() {
-        return m_mounted && ::mount("tmpfs", path().c_str(), "tmpfs", MS_REMOUNT | MS_RDONLY, nullptr) == 0;
-    }
 
 private:
     QTemporaryDir m_folder;
