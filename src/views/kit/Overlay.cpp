@@ -150,6 +150,8 @@ void Overlay::keyPressEvent(QKeyEvent* event) {
         return;
     }
     QWidget* focus = QApplication::focusWidget();
+    if (!isAncestorOf(focus))
+        focus = nullptr; // Enter in a list has opened another page, and presses nothing there
     if (!pressByEnter(*event, focus) && endsTyping(*event, focus))
         pressMain();
     event->accept(); // nothing of the page below answers meanwhile
