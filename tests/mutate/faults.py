@@ -432,7 +432,8 @@ FAULTS = {
     'src/app/Program.cpp': [
         F('reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared', 'Instances::Lock::Shared',
           'two programs write one order'),
-        F('!run.another()', 'true', 'files that another program is writing go')],
+        F('!run.another()', 'true', 'files that another program is writing go',
+          told='without Careful two programs may share a folder; a write that loses its hidden file fails, and is told')],
     'src/views/MoogMeret/MoogMeretView.cpp': [F('&MoogMeret::Command4_Click', '&MoogMeret::Command2_Click', 'the button that sends mails')],
     'src/views/kyoskNew/kyoskNewView.cpp': [
         F('m_page.Command13_Click(i);', 'm_page.Command12_Click(i);', 'minus adds a copy'),
