@@ -438,7 +438,8 @@ FAULTS = {
     'src/views/kyoskNew/kyoskNewView.cpp': [
         F('m_page.Command13_Click(i);', 'm_page.Command12_Click(i);', 'minus adds a copy'),
         F('m_next->click();', '', 'the key for the next page does nothing', seen=True),
-        F('look.copies = c.Label4[i].text;', '', 'a cell shows no copies')],
+        F('look.copies = c.Label4[i].text;', '', 'a cell shows no copies',
+          told='the order and the sum below the pages are right')],
     'src/views/kyoskNew/PictureCell.cpp': [F('m_plus->click();', 'm_minus->click();', 'the key + takes a copy away')],
     'src/views/sending/FtpFrmView.cpp': [
         F('&FtpFrm::Command15_Click', '&FtpFrm::Command11_Click', 'the button that stops does not', seen=True),
