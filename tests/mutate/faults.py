@@ -425,7 +425,8 @@ FAULTS = {
           'a package that failed counts as sent')],
     'src/start/hatchala.cpp': [F('m_state.KodMishloach = u"KUP"_s;', 'm_state.KodMishloach = u"KIN"_s;', 'the sheet tells another place')],
     'src/start/hatchalaOffer.cpp': [
-        F('m_platform.instances.another()', 'false', 'an order under way in another window is offered'),
+        F('m_platform.instances.another()', 'false', 'an order under way in another window is offered',
+          told='with Careful no second program runs; built in the number is claimed by its folder'),
         F('!asksToThrowAway(order.state.number) || m_leaving', 'm_leaving', 'an order is thrown away without a question'),
         F('order.gone > 0 && (!m_asksForGone || order.lacksAllPictures())', 'false', 'an order goes on without its pictures')],
 

@@ -380,7 +380,8 @@ TEST(FtpGuards, AnOrderThatFindsNoOtherNumberLeavesTheSessionAsItWas) {
     order.keep({u"021015GNBC:\\pics\\aabb.jpg"_s}, false);
     SessionState& state = order.rig.state;
     state.Optint = OrderKind::Album;
-    PreparedAgain again(state, order.rig.test.platform, order.journal());
+    const OrderJournal journal = order.journal();
+    PreparedAgain again(state, order.rig.test.platform, journal);
     EXPECT_FALSE(again.handOver([](const QString&) { return std::optional<bool>(); }));
     EXPECT_EQ(state.Optint, OrderKind::Album);
     EXPECT_EQ(state.MisparHazmana, u"105");

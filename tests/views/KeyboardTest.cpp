@@ -80,6 +80,11 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
     walk.key(Qt::Key_Return);
     walk.key(Qt::Key_Plus);
     EXPECT_EQ(pictures.controls().Label7.text.trimmed(), u"3"_s);
+    for (const Qt::Key code : {Qt::Key_Plus, Qt::Key_Minus, Qt::Key_PageDown})
+        walk.key(code);
+    EXPECT_EQ(pictures.controls().Label7.text.trimmed(), u"3"_s);
+    EXPECT_EQ(pictures.controls().List2.count(), 2) << "the second page";
+    walk.key(Qt::Key_PageUp);
     EXPECT_EQ(pictures.controls().List1.count(), 2);
     walk.program().window().close();
     walk.settle();

@@ -3,6 +3,7 @@
 #include "assembly/edited/B3.h"
 #include "entry/details/nnn.h"
 #include "order/EditRecord.h"
+#include "platform/Instances.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
@@ -16,6 +17,8 @@ namespace lumora {
 
 TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {
     Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
+    const HostPath data = walk.program().platform().files.drives().dataFolder();
+    EXPECT_TRUE(Instances(data, Instances::Lock::Shared).refused()) << "two programs would write one order";
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
     go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! Text2=Dana Text3=+1-212-555-01234"_s);
     lookAtPicker(walk, u"nnn"_s, u"Command12"_s, u"06-long-telephone"_s, u"messageNo"_s);

@@ -6,6 +6,7 @@
 #include "samples/SamplePhotographs.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "views/kit/ChoiceCards.h"
 #include "views/kit/Overlay.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
@@ -297,6 +298,16 @@ QStringList Walk::faults() {
         result += u"the page runs the other way"_s;
     if (english && hasHebrew(window.windowTitle()))
         result += u"a Hebrew title"_s;
+    for (const Controls::Entry& entry : m_program->chain().front()->controls().all()) {
+        const int row = entry.list ? entry.list->currentIndex() : -1;
+        const auto* cards = root->findChild<ChoiceCards*>(entry.name);
+        const QString name = cards && row >= 0 ? u"%1(%2)"_s.arg(entry.name).arg(row) : entry.name;
+        const auto* mark = root->findChild<QAbstractButton*>(name);
+        if (!mark || !mark->isCheckable())
+            continue;
+        if (mark->isChecked() != (cards || static_cast<const CheckCaption&>(*entry.caption).checked))
+            result += u"%1 shows another mark than the page has"_s.arg(name);
+    }
     for (const auto* area : root->findChildren<QScrollArea*>()) {
         const auto parts = area->widget()->findChildren<QWidget*>(Qt::FindDirectChildrenOnly);
         for (auto at = parts.begin(); at != parts.end(); ++at) {
