@@ -43,6 +43,7 @@ protected:
         walk.program().state().edit.PicturePath = path;
         walk.program().chain().load<RedI>().open(path);
         walk.waitFor(u"RedI"_s);
+        walk.settle(60);
     }
     RedI& page() { return walk.page<RedI>(PageId::RedI); }
     QPoint searched() { return {page().sight().RedSearchX, page().sight().RedSearchY}; }
