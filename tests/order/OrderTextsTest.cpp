@@ -57,12 +57,10 @@ TEST(MailAddressGuard, TakesAWholeAddressAsItIsAndNeverThePrompt) {
     }
 }
 
-TEST(OrderReport, TellsTheOrderInOneQueryForANewOrderAndForAResend) {
+TEST(OrderReport, TellsTheOrderInOneQueryButNotThatOfAChain) {
     SessionState state = orderOfDana();
     EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), reportOfDana);
     EXPECT_EQ(DoneQuery(state.profile, state.transfer), u"?t1=tarvelmond&t2=true"_s);
-    state.transfer.SugMishloah = Sending::Resend;
-    EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), reportOfDana);
     state.transfer.SugMishloah = Sending::Chain;
     EXPECT_EQ(OrderReportQuery(state.profile, state.transfer, state.shemot), QString());
     EXPECT_EQ(DoneQuery(state.profile, state.transfer), QString());
