@@ -121,9 +121,7 @@ TEST_F(TheEditor, dragsByAThirteenthOfTheWayAtEachMoveAndKeepsFractions) {
         editor.PicPic_MouseMove({107, 100 - 13.0 / 6});
     EXPECT_FALSE(shown().Frame3.visible);
     EXPECT_EQ(state.edit.PanX, 225); // the record waits for the release
-    const QImage dragged = shown().PicPic.image();
     editor.PicPic_MouseUp();
-    EXPECT_EQ(shown().PicPic.image(), dragged);
     editor.PicPic_MouseMove({300, 300});
     EXPECT_EQ(storedField(EditRecord::PanX) + storedField(EditRecord::PanY),
               u"227 150 "_s); // 226.6, and 149.5 to the even one

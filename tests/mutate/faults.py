@@ -309,7 +309,8 @@ FAULTS = {
         F('EditStep::gain(edit.GainB, -step)', 'edit.GainB', 'more red leaves blue'),
         F('edit.ToneFlag = 1;', '', 'a grey picture prints in colour')],
     'src/editing/editor/tFrmNewMove.cpp': [F('PackEditState();', '', 'a zoom is shown and not printed'),
-                                           F('meanwhile.PanX = HoldIn16Bits(Image3.position().x());', '', 'a dragged picture does not follow')],
+                                           F('meanwhile.PanX = HoldIn16Bits(Image3.position().x());', '', 'a dragged picture does not follow',
+          told='the record and the print are right once the finger is lifted')],
     'src/editing/caption/CaptionGuard.cpp': [F('edit.TextOn = 1;', '', 'a caption that is opened again is not printed')],
     'src/editing/caption/KeyLayout.cpp': [F('AnsiCodePage::squeeze(text) != text', 'false', 'a caption shows signs that the record has not')],
 
@@ -408,7 +409,8 @@ FAULTS = {
         F('order.report == Report::Begun', 'false', 'the lab may be told twice'),
         F('m_state.profile.ReportOn > 0', 'true', 'a lab is told that wants no report'),
         F('(heard && done) || !m_state.Careful', 'true', 'a report that nobody heard counts as told'),
-        F('isDue(by) && !m_journal.state().sentBefore', 'isDue(by)', 'an old order is told as new')],
+        F('isDue(by) && !m_journal.state().sentBefore', 'isDue(by)', 'an old order is told as new',
+          told='an order of an older version alone, and a report prints nothing')],
     'src/transfer/report/InetForm.cpp': [F('u"c.txt"_s', 'u"c"_s', "the lab's site does not expect the report")],
 
     'src/finished/pieces/Mod4split.cpp': [
