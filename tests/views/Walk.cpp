@@ -299,14 +299,13 @@ QStringList Walk::faults() {
     if (english && hasHebrew(window.windowTitle()))
         result += u"a Hebrew title"_s;
     for (const Controls::Entry& entry : m_program->chain().front()->controls().all()) {
-        const int row = entry.list ? entry.list->currentIndex() : -1;
-        const auto* cards = root->findChild<ChoiceCards*>(entry.name);
-        const QString name = cards && row >= 0 ? u"%1(%2)"_s.arg(entry.name).arg(row) : entry.name;
-        const auto* mark = root->findChild<QAbstractButton*>(name);
-        if (!mark || !mark->isCheckable())
+        if (!entry.caption)
             continue;
-        if (mark->isChecked() != (cards || static_cast<const CheckCaption&>(*entry.caption).checked))
-            result += u"%1 shows another mark than the page has"_s.arg(name);
+        const auto* cards = root->findChild<ChoiceCards*>(entry.name);
+        const auto* mark = cards ? cards->card(entry.caption->text) : root->findChild<QAbstractButton*>(entry.name);
+        if (mark && mark->isCheckable() &&
+            mark->isChecked() != (cards || static_cast<const CheckCaption&>(*entry.caption).checked))
+            result += u"%1 shows another mark than the page has"_s.arg(entry.name);
     }
     for (const auto* area : root->findChildren<QScrollArea*>()) {
         const auto parts = area->widget()->findChildren<QWidget*>(Qt::FindDirectChildrenOnly);
