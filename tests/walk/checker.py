@@ -93,7 +93,7 @@ class Walk:
                     promise = copy.deepcopy(order.__dict__) | {'leftOut': ''}
                 if line['before'] in ('Form2', 'B3') and line['front'] == 'kyoskNew':  # back to the pictures: the order is taken apart
                     promise = None
-                if line['before'] == 'hatchala' and line['front'] in SENDING:  # an earlier order, checked when it was prepared
+                if line['front'] in SENDING and line['before'] not in ('Form2', 'B3'):  # an earlier order, checked when it was prepared
                     promise = None
                 here = self.record / str(line['n']) / 'orders'
                 kept = here if here.is_dir() else kept
