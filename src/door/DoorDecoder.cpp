@@ -49,8 +49,7 @@ PictureHeader headerOf(const Descriptor& file) {
     }));
 }
 
-Result<DoorNeed> needOf(const Descriptor& file, const std::filesystem::path& source) {
-    const PictureHeader header = headerOf(file);
+Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source) {
     const DoorNeed need = doorNeedOf(header, nameOf(source));
     if (need != DoorNeed::Unreadable)
         return need;
@@ -202,7 +201,7 @@ DoorDecoder::DoorDecoder(std::filesystem::path program, DoorLimits limits)
 
 Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source) {
     const auto file = openSource(source, nameOf(source));
-    return file ? lumora::needOf(*file, source) : file.failure();
+    return file ? lumora::needOf(headerOf(*file), *file, source) : file.failure();
 }
 
 Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
@@ -210,7 +209,8 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     const auto file = openSource(source, nameOf(source));
     if (!file)
         return file.failure();
-    const auto need = lumora::needOf(*file, source);
+    const PictureHeader header = headerOf(*file);
+    const auto need = lumora::needOf(header, *file, source);
     if (!need)
         return need.failure();
     NewContent content(target, nameOf(target));
@@ -218,7 +218,7 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     if (*need == DoorNeed::Nothing || *need == DoorNeed::Copy) {
         if (const auto copied = appendFrom(*file, toTheEnd, content, nameOf(source)); !copied)
             return copied.failure();
-        result->profileIgnored = coloursOf(headerOf(*file)).profileIgnored;
+        result->profileIgnored = coloursOf(header).profileIgnored;
     } else {
         QByteArray bytes;
         result = decoded(m_program, m_limits, *file, source, bytes);
