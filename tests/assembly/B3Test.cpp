@@ -56,6 +56,19 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
 }
 
 // Flat pictures, so that one pixel tells which picture was printed and in which colours.
+TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
+    const QString bad = giveFile(u"bad_1.jpg"_s, "no picture");
+    for (const bool careful : {false, true}) {
+        state.Careful = careful;
+        start(openEither(true, {edited(bad)}));
+        EXPECT_EQ(front(), careful ? PageId::B3 : PageId::FtpFrm);
+        EXPECT_TRUE(printFiles().isEmpty());
+        chain.unload(front());
+        std::filesystem::remove_all(host(folder()));
+        state.MisparHazmana = u"105"_s;
+    }
+}
+
 TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     const QColor first(200, 80, 20), second(20, 160, 120), fixed(60, 60, 200);
     const auto grey = [](QColor colour) {
