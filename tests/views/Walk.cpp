@@ -169,6 +169,7 @@ Page* Walk::find(PageId id) {
 
 void Walk::settle(int milliseconds) {
     QTest::qWait(milliseconds);
+    m_program->window().renderNow(); // a busy machine may not have come to it in that time
 }
 
 void Walk::expectDone(const Result<void>& step) {
