@@ -1,0 +1,106 @@
+#include "platform/media/Cards.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace lumora {
+
+struct Cards::Entry {
+    Card card;
+    std::shared_ptr<std::atomic_bool> stop = std::make_shared<std::atomic_bool>(false);
+};
+
+Cards::Cards(Source source)
+    : m_source(std::move(source)) {}
+
+Cards::~Cards() {
+    for (const auto& entry : m_cards)
+        *entry->stop = true;
+    if (m_thread) {
+        m_thread->quit();
+        m_thread->wait();
+    }
+    for (QThread* counting : m_counts) {
+        counting->wait();
+        delete counting;
+    }
+}
+
+void Cards::watch() {
+    if (++m_watchers > 1 || !m_source)
+        return;
+    RemovableMedia* media = m_source().release();
+    m_thread = std::make_unique<QThread>();
+    media->moveToThread(m_thread.get());
+    connect(m_thread.get(), &QThread::started, media, &RemovableMedia::begin);
+    connect(m_thread.get(), &QThread::finished, media, &QObject::deleteLater);
+    connect(media, &RemovableMedia::found, this, [this, thread = m_thread.get()](const std::vector<Medium>& found) {
+        if (m_thread.get() == thread)
+            take(found);
+    });
+    m_thread->start();
+}
+
+void Cards::unwatch() {
+    if (--m_watchers > 0 || !m_thread)
+        return;
+    m_thread->quit();
+    m_thread->wait();
+    m_thread.reset();
+    take({});
+}
+
+std::vector<Cards::Card> Cards::all() const {
+    std::vector<Card> cards;
+    for (const auto& entry : m_cards)
+        cards.push_back(entry->card);
+    return cards;
+}
+
+void Cards::take(const std::vector<Medium>& media) {
+    bool differs = false;
+    for (std::size_t i = m_cards.size(); i-- > 0;) {
+        if (std::find(media.begin(), media.end(), m_cards[i]->card.medium) == media.end()) {
+            forget(i);
+            differs = true;
+        }
+    }
+    for (const Medium& medium : media) {
+        const bool known = std::any_of(m_cards.begin(), m_cards.end(),
+                                       [&](const auto& entry) { return entry->card.medium == medium; });
+        if (known)
+            continue;
+        m_cards.push_back(std::make_unique<Entry>());
+        m_cards.back()->card.medium = medium;
+        count(*m_cards.back());
+        differs = true;
+    }
+    if (differs)
+        Q_EMIT changed();
+}
+
+void Cards::forget(std::size_t entry) {
+    *m_cards[entry]->stop = true;
+    m_cards.erase(m_cards.begin() + static_cast<std::ptrdiff_t>(entry));
+}
+
+void Cards::count(Entry& entry) {
+    const auto summary = std::make_shared<CardSummary>();
+    const auto stop = entry.stop;
+    QThread* counting =
+        QThread::create([summary, stop, root = entry.card.medium.folder] { *summary = summaryOfCard(root, *stop); });
+    m_counts.push_back(counting);
+    connect(counting, &QThread::finished, this, [this, counting, summary, stop] {
+        std::erase(m_counts, counting);
+        counting->deleteLater();
+        const auto card =
+            std::find_if(m_cards.begin(), m_cards.end(), [&](const auto& counted) { return counted->stop == stop; });
+        if (card == m_cards.end())
+            return;
+        (*card)->card.summary = *summary;
+        Q_EMIT changed();
+    });
+    counting->start();
+}
+
+} // namespace lumora
