@@ -41,6 +41,14 @@ void warn(const QString& text) {
     std::fprintf(stderr, "lumora: %s\n", qPrintable(text));
 }
 
+// Beside this program, or where a build has it.
+HostPath doorProgram() {
+    const HostPath here = toHostPath(QCoreApplication::applicationDirPath());
+    std::error_code none;
+    const HostPath beside = here / "lumora-door";
+    return std::filesystem::exists(beside, none) ? beside : here / "../../tools/door/lumora-door";
+}
+
 } // namespace
 
 // Each member uses only those above it.
@@ -58,7 +66,8 @@ struct Program::Parts {
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files)
-        , platform{files, dialogs, line ? *line : internet, mail, shell, clock, pump, volume, instances} {
+        , platform{files,     dialogs,      line ? *line : internet, mail, shell, clock, pump, volume,
+                   instances, doorProgram()} {
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
             const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);

@@ -49,8 +49,9 @@ PictureHeader headerOf(const Descriptor& file) {
     }));
 }
 
-Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source) {
-    const DoorNeed need = doorNeedOf(header, nameOf(source));
+Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source,
+                        DoorRules rules = {true, true, true}) {
+    const DoorNeed need = doorNeedOf(header, nameOf(source), rules);
     if (need != DoorNeed::Unreadable)
         return need;
     if (header.kind != PictureKind::None)
@@ -177,7 +178,7 @@ Result<DoorDecoder::Made> decoded(const std::filesystem::path& program, const Do
     const Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
     Child child;
     if (const int error = made.valid() ? child.start(program, limits, file.number(), made.number()) : errno; error != 0)
-        return fileFailure(program, u"can't be started"_s, error);
+        return Failure{Failure::Kind::Other, fileFailure(program, u"can't be started"_s, error).message};
     const auto status = child.ended(limits.seconds);
     if (!status)
         return failureOf(source, Failure::Kind::TimedOut, u"this file takes too long to decode"_s);
@@ -199,9 +200,9 @@ DoorDecoder::DoorDecoder(std::filesystem::path program, DoorLimits limits)
     : m_program(std::move(program))
     , m_limits(limits) {}
 
-Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source) {
+Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source, DoorRules rules) {
     const auto file = openSource(source, nameOf(source));
-    return file ? lumora::needOf(headerOf(*file), *file, source) : file.failure();
+    return file ? lumora::needOf(headerOf(*file), *file, source, rules) : file.failure();
 }
 
 Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,

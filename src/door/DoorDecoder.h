@@ -17,7 +17,7 @@ public:
     explicit DoorDecoder(std::filesystem::path program, DoorLimits limits = {});
 
     // Reads the header alone.
-    static Result<DoorNeed> needOf(const std::filesystem::path& source);
+    static Result<DoorNeed> needOf(const std::filesystem::path& source, DoorRules rules = {true, true, true});
 
     struct Made {
         bool profileIgnored = false; // the colour profile is broken, so that the colours were taken as sRGB

@@ -89,13 +89,13 @@ HeaderColours coloursOf(const PictureHeader& header) {
     return colours;
 }
 
-DoorNeed doorNeedOf(const PictureHeader& header, const QString& fileName) {
+DoorNeed doorNeedOf(const PictureHeader& header, const QString& fileName, DoorRules rules) {
     const bool noFrame = header.kind == PictureKind::Jpeg && (header.size.width < 1 || header.size.height < 1);
     if (header.kind == PictureKind::None || noFrame)
         return DoorNeed::Unreadable;
-    if (header.kind != PictureKind::Jpeg || coloursOf(header).source != Source::None)
+    if (header.kind != PictureKind::Jpeg || (rules.srgb && coloursOf(header).source != Source::None))
         return DoorNeed::Decode;
-    if (header.orientation != 1)
+    if (rules.upright && header.orientation != 1)
         return DoorNeed::Turn;
     return fileName.endsWith(u".jpg"_s) || fileName.endsWith(u".JPG"_s) ? DoorNeed::Nothing : DoorNeed::Copy;
 }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DoorRules.h"
 #include "door/PictureHeader.h"
 
 #include <QString>
@@ -26,6 +27,8 @@ HeaderColours coloursOf(const PictureHeader& header);
 // Colours by the numbers of a video standard; none where they are sRGB's, or not told.
 HeaderColours codedColours(PictureHeader::CodedColours coded);
 
-DoorNeed doorNeedOf(const PictureHeader& header, const QString& fileName);
+// What the rules do not ask for is not done to a JPEG. What goes through for another reason comes out upright and in
+// sRGB all the same.
+DoorNeed doorNeedOf(const PictureHeader& header, const QString& fileName, DoorRules rules = {true, true, true});
 
 } // namespace lumora

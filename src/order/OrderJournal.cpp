@@ -1,6 +1,7 @@
 #include "order/OrderJournal.h"
 
 #include "order/BasketLine.h"
+#include "order/DoorFolders.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderNames.h"
@@ -121,6 +122,7 @@ Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
         const DrivePath aside = m_folder.keptWorkPath();
         if (m_files.folderExists(aside))
             static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
+        removeDoorFolders(m_files, m_state.items);
     }
     return kept;
 }

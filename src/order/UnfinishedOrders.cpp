@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "order/BasketLine.h"
+#include "order/DoorFolders.h"
 #include "order/EditRecord.h"
 #include "order/FinishedOrder.h"
 #include "order/LeftOutPictures.h"
@@ -113,6 +114,7 @@ void takeUpSending(const UnfinishedOrder& order, SessionState& state, const File
 void TidyOrders(const SessionState& state, const Files& files) {
     const DrivePath orders = WorkspacePaths::orders(state);
     const QStringList names = files.folders(orders);
+    tidyDoorFolders(state, files);
     for (const QString& name : names) {
         if (!FinishedOrderOf(name))
             continue;
@@ -256,7 +258,11 @@ bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const File
 }
 
 Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder) {
-    return files.removeTree(folder.path());
+    const Result<OrderState> order = ReadOrderState(files, folder);
+    Result<void> removed = files.removeTree(folder.path());
+    if (removed && order)
+        removeDoorFolders(files, order->items);
+    return removed;
 }
 
 } // namespace lumora

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/files/HostPath.h"
+
 namespace lumora {
 
 class Clock;
@@ -23,6 +25,7 @@ struct Platform {
     EventPump& pump;
     const Volume& volume;
     const Instances& instances;
+    HostPath doorProgram; // lumora-door, which decodes what is no ordinary JPEG; where it is missing nothing is decoded
 };
 
 } // namespace lumora

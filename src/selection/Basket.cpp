@@ -61,6 +61,13 @@ void Basket::removeAt(int index) {
         m_indexed = false;
 }
 
+QStringList Basket::paths() const {
+    QStringList paths;
+    for (const QString& line : m_lines.items())
+        paths += pathOf(line);
+    return paths;
+}
+
 int Basket::SumCopies() const {
     return HoldIn16Bits(static_cast<double>(m_copies));
 }

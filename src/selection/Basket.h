@@ -21,6 +21,8 @@ public:
     int count() const { return m_lines.count(); }
     bool isEmpty() const { return m_lines.isEmpty(); }
     QString item(int index) const { return m_lines.item(index); }
+    // The paths of all lines.
+    QStringList paths() const;
     // The reading position of the pages of chosen pictures.
     int currentIndex() const { return m_lines.currentIndex(); }
     void setCurrentIndex(int index) { m_lines.setCurrentIndex(index); }

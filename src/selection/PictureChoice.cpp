@@ -30,7 +30,8 @@ void PictureChoice::put(const BasketLine& line) {
 
 void PictureChoice::turnTo(const QStringList& paths) {
     m_page.clear();
-    m_page.append(paths);
+    for (const QString& path : paths)
+        m_page.append(m_worked(path));
     markPage();
 }
 
@@ -116,8 +117,16 @@ void PictureChoice::setCopies(int cell, int copies) {
     markPage();
 }
 
-void PictureChoice::chooseAll() {
-    for (const QString& path : m_folders.paths().items()) {
+void PictureChoice::remove(const QString& path) {
+    m_basket.removeAt(m_basket.FindByPath(path));
+    markPage();
+}
+
+void PictureChoice::chooseAll(const std::function<bool(const QString&)>& isUnreadable) {
+    for (const QString& listed : m_folders.paths().items()) {
+        const QString path = m_worked(listed);
+        if (isUnreadable && isUnreadable(path))
+            continue;
         const int index = m_state.Careful ? m_basket.FindByPath(path) : -1;
         const int copies = index < 0 ? 1 : PrintCode::copiesOf(m_basket.item(index));
         const PaperWords words = m_state.Careful ? PaperWords::All : PaperWords::WholeFolder;

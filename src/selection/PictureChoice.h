@@ -6,6 +6,7 @@
 #include "selection/SeenPages.h"
 
 #include <array>
+#include <functional>
 #include <optional>
 
 namespace lumora {
@@ -22,10 +23,14 @@ public:
         , m_seen(state) {}
     // Once, before any picture is chosen.
     void setForm(LineForm form) { m_basket.setForm(form); }
+    // What the page works with in the place of a picture of a folder (selection/door/PictureDoor.h). Without it each
+    // picture stands for itself.
+    void setWorked(std::function<QString(const QString&)> worked) { m_worked = std::move(worked); }
 
     const Basket& basket() const { return m_basket; }
     const FolderPager& folders() const { return m_folders; }
-    // The paths of the page in view, one a cell.
+    // The paths of the page in view, one a cell, as the page works with them; those of the folders are as they lie
+    // there.
     const TextList& page() const { return m_page; }
     // Empty for a cell without a picture.
     QString path(int cell) const { return m_page.item(cell); }
@@ -57,8 +62,11 @@ public:
     // The rest of a line stays, its record too; a line that is added has the record of a new picture. 0 copies remove
     // the line.
     void setCopies(int cell, int copies);
-    // Every picture of the folders. As built in, each has one copy then, and the English words give no paper letter.
-    void chooseAll();
+    // A picture that can't be printed after all.
+    void remove(const QString& path);
+    // Every picture of the folders but those that can't be read. As built in, each has one copy then, and the English
+    // words give no paper letter.
+    void chooseAll(const std::function<bool(const QString&)>& isUnreadable = {});
     // The index of the line that has the record now, or -1 when the picture is not chosen.
     int storeRecord(const QString& path, const QString& record);
     void removeDuplicates() { m_basket.removeDuplicates(); }
@@ -70,6 +78,7 @@ private:
     void turnTo(const QStringList& paths);
 
     const SessionState& m_state;
+    std::function<QString(const QString&)> m_worked = [](const QString& path) { return path; };
     Basket m_basket;
     FolderPager m_folders;
     SeenPages m_seen;

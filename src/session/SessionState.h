@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DoorRules.h"
 #include "common/DrivePath.h"
 #include "platform/line/Mail.h"
 
@@ -226,6 +227,7 @@ struct HandOver {
     QStringList pictures;    // all pictures that it offered
     ClosingEntries closing;  // what was typed there
     OrderDetails details;    // of the order, without mail address and note
+    DrivePath doorFolder;    // where its pictures were made that are no ordinary JPEG files
     bool back = false;       // it takes all of them back
 };
 
@@ -253,6 +255,7 @@ struct SessionState {
     bool SplitPage = false;              // the finished orders lead to the pieces, an operator's tool
     bool ModulRezef = false;             // the order is picked in one sequence, kinds 3 and 10
     bool Careful = false;                // the guards of docs/guards.md are on
+    DoorRules door;                      // what is let through of the pictures that customers bring
     AlbumTail albumTail = AlbumTail::Customer;
     bool offerPutOff = false; // the customer has put off the unfinished orders for this run
     bool OperatorArea = true; // a customer may open the hidden area of the sending page

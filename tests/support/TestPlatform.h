@@ -133,7 +133,7 @@ public:
         : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
         , instances(drives.dataFolder())
-        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances} {}
+        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, {}} {}
 
     QTemporaryDir folder;
     Drives drives;

@@ -225,6 +225,13 @@ Result<qint64> Files::size(const DrivePath& path) const {
 }
 
 QStringList Files::names(const DrivePath& folder, const QString& patterns) const {
+    QStringList names = storedNames(folder, patterns);
+    for (QString& name : names)
+        name = AnsiCodePage::squeeze(name);
+    return names;
+}
+
+QStringList Files::storedNames(const DrivePath& folder, const QString& patterns) const {
     QStringList wanted;
     for (const QString& pattern : patterns.split(u';', Qt::SkipEmptyParts))
         wanted += pattern.trimmed();
@@ -234,7 +241,7 @@ QStringList Files::names(const DrivePath& folder, const QString& patterns) const
         return names;
     for (const QString& name : entries(*found, Wanted::Files)) {
         if (matchesAny(wanted, name))
-            names += AnsiCodePage::squeeze(name);
+            names += name;
     }
     return names;
 }
@@ -270,7 +277,7 @@ void FileList::setPattern(const QString& patterns) {
 }
 
 void FileList::refresh() {
-    m_names = m_files.names(m_folder, m_pattern);
+    m_names = m_as == Names::Stored ? m_files.storedNames(m_folder, m_pattern) : m_files.names(m_folder, m_pattern);
 }
 
 } // namespace lumora

@@ -54,6 +54,8 @@ public:
     // case, "!" before digits before letters. A character outside the code page is "?". Empty when the folder can't be
     // read.
     QStringList names(const DrivePath& folder, const QString& patterns) const;
+    // The same with the characters outside the code page as they are.
+    QStringList storedNames(const DrivePath& folder, const QString& patterns) const;
 
     // Leaf names of the sub-folders, sorted likewise.
     QStringList folders(const DrivePath& folder) const;
@@ -73,9 +75,11 @@ private:
 // by refresh().
 class FileList {
 public:
-    explicit FileList(const Files& files, QString pattern = QStringLiteral("*.*"))
+    enum class Names { InCodePage, Stored };
+    explicit FileList(const Files& files, QString pattern = QStringLiteral("*.*"), Names as = Names::InCodePage)
         : m_files(files)
-        , m_pattern(std::move(pattern)) {}
+        , m_pattern(std::move(pattern))
+        , m_as(as) {}
 
     void setFolder(const DrivePath& folder);
     void setPattern(const QString& patterns);
@@ -90,6 +94,7 @@ private:
     const Files& m_files;
     DrivePath m_folder;
     QString m_pattern;
+    Names m_as;
     QStringList m_names;
 };
 

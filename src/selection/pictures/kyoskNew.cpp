@@ -9,6 +9,8 @@
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
+#include "selection/door/DoorNames.h"
+#include "selection/door/PictureDoor.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 
@@ -25,13 +27,19 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
     , m_state(state)
     , m_platform(platform)
     , m_chain(chain)
+    , m_door(std::make_unique<PictureDoor>(platform.files, DoorDecoder(platform.doorProgram), state.door))
     , m_choice(state)
     , m_resolution(state, platform.files)
-    , File1(platform.files, u"*.jpg"_s)
+    , File1(platform.files, picturePatterns(state.door.everyFormat),
+            state.door.any() ? FileList::Names::Stored : FileList::Names::InCodePage)
     , Timer1(40, [this] { moveLabel35(); })
     , Timer2(500, [this] { movePointers(); }) {}
 
-kyoskNew::~kyoskNew() = default;
+// Nothing leads any more to what was made for an order that was not handed over.
+kyoskNew::~kyoskNew() {
+    if (!m_handedOver && !m_door->folder().isEmpty())
+        static_cast<void>(m_platform.files.removeTree(m_door->folder()));
+}
 
 bool kyoskNew::plain() const {
     return printsAsTheyAre(m_state.Optint);
@@ -62,6 +70,7 @@ void kyoskNew::load() {
     Label33.visible = box != AddressBox::None && !m_state.DoarReshut;
 
     const HandOver before = std::exchange(m_state.handOver, {});
+    openDoor(before);
     if (before.back)
         takeBack(before);
     else
@@ -116,17 +125,21 @@ void kyoskNew::showCell(int cell) {
     const auto at = static_cast<std::size_t>(cell);
     const QString path = m_choice.path(cell);
     const QString copies = QString::number(m_choice.copies(cell));
-    const QString name = LeafName(path);
+    const QString name = shownPath(path).leaf();
     const auto words = [&](const char16_t* hebrew, const char16_t* english) {
         return m_state.wording(hebrew, english).arg(name);
     };
     const std::optional<PrintResolution> prints = m_resolution.of(path, m_choice.recordOf(path).value_or(QString()));
     resolution[at].show(prints);
     Picture1[at].text = path;
+    Picture1[at].name = path.isEmpty() ? QString() : name;
+    Picture1[at].waiting = m_door->isWaiting(path);
+    Picture1[at].unreadable = m_door->isUnreadable(path) ? unreadableText(path) : QString();
     Picture4[at].visible = m_choice.chosen(cell);
     Label4[at].text = copies;
-    Label5[at].text = path.isEmpty() ? u"*"_s : RightPart(path, 20);
-    Picture1[at].spoken = path.isEmpty() ? m_state.wording(u"תא ריק", u"Empty place")
+    Label5[at].text = path.isEmpty() ? u"*"_s : RightPart(shownPath(path).text(), 20);
+    Picture1[at].spoken = path.isEmpty()               ? m_state.wording(u"תא ריק", u"Empty place")
+                          : m_door->isUnreadable(path) ? name + u", "_s + Picture1[at].unreadable
                           : m_choice.chosen(cell)
                               ? m_state.wording(u"%1, נבחרה, עותקים: %2", u"%1, chosen, copies: %2").arg(name, copies)
                           : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
@@ -140,7 +153,7 @@ void kyoskNew::showCell(int cell) {
 
 void kyoskNew::takeInHand(const QString& path) {
     m_largePath = DrivePath(path);
-    Label1.text = Label2.text = path;
+    Label1.text = Label2.text = shownPath(path).text();
 }
 
 void kyoskNew::setScreenHeight(int pixels) {

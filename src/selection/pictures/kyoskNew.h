@@ -13,10 +13,12 @@
 
 #include <functional>
 #include <initializer_list>
+#include <memory>
 
 namespace lumora {
 
 class PageChain;
+class PictureDoor;
 struct Platform;
 struct HandOver;
 struct SessionState;
@@ -81,6 +83,7 @@ public:
     void Command3_Click() { checkAndClose(); }
     void Command4Snif_Click(int branch) { chooseBranch(branch); }
     void Command4Snif_MouseMove(int branch) { showBranch(branch); } // also when it takes the focus
+    void doorBack_Click() { stopWaiting(); }
     void Image33_Click() { offerBranches(); }
     void Command28_Click() { closeBranches(); }
     void Command20_Click() { setDeepCompression(false); }
@@ -167,6 +170,19 @@ private:
     void moveLabel35();
     void movePointers();
 
+    void openDoor(const HandOver& before);
+    QStringList nextPictures() const;
+    void orderPictures();
+    void pictureSettled(const QString& path);
+    void takeOut(const QString& path);
+    void tellTakenOut();
+    int waitingPictures() const;
+    bool waitsForPictures();
+    void showWaiting();
+    void stopWaiting();
+    QString unreadableText(const QString& path) const;
+    DrivePath shownPath(const QString& path) const;
+
     tFrmNew& editor() const;
     void leaveEditor();
     void storeSmallView();
@@ -207,6 +223,7 @@ private:
     SessionState& m_state;
     const Platform& m_platform;
     PageChain& m_chain;
+    std::unique_ptr<PictureDoor> m_door;
     PictureChoice m_choice;
     OrderResolution m_resolution;
     FileList File1;
@@ -227,8 +244,11 @@ private:
     Guide m_guide = Guide::None;
     PrintGrade m_grade = PrintGrade::Unmarked; // what Label6 tells, and of which size
     PictureSize m_gradedSize;
-    PictureSize m_largeSize; // of the picture in the large view
-    QStringList m_coarse;    // the paths that the closing panel tells of
+    PictureSize m_largeSize;    // of the picture in the large view
+    QString m_openWhenMade;     // the picture that goes into the editor once it is made
+    bool m_notMadeTold = false; // that the disk has not taken a picture
+    QStringList m_takenOut;     // names of chosen pictures that can't be printed, until the customer is told
+    QStringList m_coarse;       // the paths that the closing panel tells of
     QString m_focusBox;
     int m_focusRequest = 0;
 };

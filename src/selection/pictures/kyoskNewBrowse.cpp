@@ -7,6 +7,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/PrintQuality.h"
+#include "selection/door/PictureDoor.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -81,7 +82,7 @@ void kyoskNew::pickFolder() {
     Q_EMIT changed();
 
     // A picture whose own name is outside the code page fails alone, when the order is prepared.
-    if (plain() && HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text())) {
+    if (plain() && !m_door->isOpen() && HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text())) {
         m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
         return;
     }
@@ -115,12 +116,16 @@ void kyoskNew::takeFolderOf(const DrivePath& picture) {
     m_choice.addFolder(folder, File1.names());
     Label29.text = folder.text();
     showPictureCount();
-    if (File1.count() == 0)
-        m_platform.dialogs.message(m_state
-                                       .wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
-                                                u"There are no JPG pictures in the folder\n%1\nSelect a picture of "
-                                                u"another folder")
-                                       .arg(folder.text()));
+    if (File1.count() > 0)
+        return;
+    const QString none = m_state.door.everyFormat
+                             ? m_state.wording(u"לא נמצאו תמונות בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
+                                               u"There are no pictures in the folder\n%1\n"
+                                               u"Select a picture of another folder")
+                             : m_state.wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
+                                               u"There are no JPG pictures in the folder\n%1\n"
+                                               u"Select a picture of another folder");
+    m_platform.dialogs.message(none.arg(folder.text()));
 }
 
 void kyoskNew::showPictureCount() {
@@ -141,6 +146,7 @@ void kyoskNew::showFolderOffer() {
 
 void kyoskNew::drawPage() {
     clearCells();
+    orderPictures();
     showChoice();
     drawCells();
 }
@@ -171,6 +177,8 @@ void kyoskNew::drawCells() {
             // A file that can't be read leaves its cell empty, and the page goes on.
             CellPicture& shown = Picture1[static_cast<std::size_t>(cell)];
             Result<Bitmap>& picture = pictures[static_cast<std::size_t>(cell - first)];
+            if (!picture && !m_door->isWaiting(m_choice.path(cell)))
+                m_door->foundUnreadable(m_choice.path(cell));
             shown.bitmap = picture ? std::move(*picture) : Bitmap();
             shown.visible = true;
             m_resolution.look(m_choice.path(cell));

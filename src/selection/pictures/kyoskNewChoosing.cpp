@@ -6,6 +6,7 @@
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "selection/HandOverFiles.h"
+#include "selection/door/PictureDoor.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -14,8 +15,11 @@ namespace lumora {
 
 void kyoskNew::choosePicture(int cell) {
     const QString path = m_choice.path(cell);
-    if (path.isEmpty())
+    if (path.isEmpty() || m_door->isUnreadable(path))
         return;
+    m_openWhenMade = !plain() && m_door->isWaiting(path) ? path : QString();
+    if (!m_openWhenMade.isEmpty())
+        return orderPictures();
     if (plain()) {
         m_choice.choose(cell, {});
         showLarge(DrivePath(path));
@@ -64,7 +68,7 @@ void kyoskNew::leaveEditor() {
 }
 
 void kyoskNew::addCopies(int cell, int more) {
-    if (!m_choice.path(cell).isEmpty())
+    if (!m_choice.path(cell).isEmpty() && !m_door->isUnreadable(m_choice.path(cell)))
         setCopies(cell, m_choice.copies(cell) + more);
 }
 
@@ -98,7 +102,7 @@ void kyoskNew::cancelPage() {
 }
 
 void kyoskNew::chooseWholeFolder() {
-    m_choice.chooseAll();
+    m_choice.chooseAll([this](const QString& path) { return m_door->isUnreadable(path); });
     Timer2.stop();
     for (Caption* part : {&Label35, &Image13, &Label36, &Image20})
         part->visible = false;

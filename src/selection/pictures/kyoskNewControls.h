@@ -21,6 +21,9 @@ struct SpokenCaption : Caption {
 struct CellPicture : SpokenCaption {
     using SpokenCaption::SpokenCaption;
     Bitmap bitmap;
+    QString name;         // the customer's own
+    QString unreadable;   // why it can't be chosen
+    bool waiting = false; // it is being made
 };
 
 // The large view: either a picture or lines of guidance.
@@ -101,6 +104,11 @@ struct kyoskNewControls : Controls {
     int label35Left = 0; // logical pixels; Timer1 moves it
     Caption Label36{*this, u"Label36", Caption::At::Hidden};
     int pointerStep = 0; // 0 to 3; Timer2 moves the pointers Image19 and Image20 by it
+
+    Caption doorPanel{*this, u"doorPanel", Caption::At::Hidden}; // the chosen pictures are being made
+    Caption doorNote{*this, u"doorNote"};
+    double doorShare = 0; // 0 to 1, of the chosen pictures
+    Caption doorBack{*this, u"doorBack"};
 
     Caption Frame3{*this, u"Frame3", Caption::At::Hidden}; // leaving with pictures chosen
     Caption Label11{*this, u"Label11"};

@@ -6,6 +6,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/HomeAddress.h"
+#include "selection/door/PictureDoor.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -22,6 +23,8 @@ const QString notTyped = u"לא הוקלד"_s; // the mail address of a customer
 } // namespace
 
 void kyoskNew::finish() {
+    if (waitsForPictures())
+        return;
     openBranches();
     checkAndClose();
 }
@@ -243,6 +246,7 @@ void kyoskNew::handOver(const QString& mail) {
     Timer2.stop();
     m_platform.pump.pump();
     m_state.handOver.lines = m_state.handOver.basket = List1.items();
+    m_state.handOver.doorFolder = m_door->folder();
     m_state.handOver.pictures = List4.items();
     m_state.handOver.pressStart = plain();
     m_chain.follow(pageId, plain() ? Outcome::PlainChosen : Outcome::EditedChosen);

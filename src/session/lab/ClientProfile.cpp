@@ -48,6 +48,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.TmunatPaar = deployment.TmunatPaar;
     state.SplitPage = deployment.SplitPage;
     state.Careful = deployment.Careful;
+    state.door = deployment.door;
     state.OperatorArea = deployment.OperatorArea;
     state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DoorRules.h"
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
@@ -33,6 +34,7 @@ struct Deployment {
     bool OperatorArea = true;
     bool OperatorEditor = false;
     AlbumTail albumTail = AlbumTail::Customer;
+    DoorRules door;
 
     QChar programLetter = u'C'; // letter of the program's own drive
     QString dataFolder;         // host folder behind it; empty: the user's data folder

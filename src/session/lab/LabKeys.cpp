@@ -24,6 +24,10 @@ auto at(T P::*field) {
     return [field](D& d) -> T& { return d.profile.*field; };
 }
 
+auto at(bool DoorRules::*field) {
+    return [field](D& d) -> bool& { return d.door.*field; };
+}
+
 template <class T>
 auto at(T MailAccount::*field) {
     return [field](D& d) -> T& { return d.profile.mail.*field; };
@@ -232,6 +236,12 @@ std::vector<Row> rows() {
         {"Switches", "SplitPage", yesNo(at(&D::SplitPage), true, false)},
 
         {"Guards", "Careful", yesNo(at(&D::Careful), true, false)},
+
+        {"Door", "Formats",
+         words<bool>(at(&DoorRules::everyFormat), u"jpg or all"_s, {{u"jpg"_s, false}, {u"all"_s, true}})},
+        {"Door", "Upright", yesNo(at(&DoorRules::upright), true, false)},
+        {"Door", "Colour",
+         words<bool>(at(&DoorRules::srgb), u"stored or sRGB"_s, {{u"stored"_s, false}, {u"sRGB"_s, true}})},
 
         {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
         {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},

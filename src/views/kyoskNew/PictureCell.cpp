@@ -36,7 +36,7 @@ void PictureCell::show(const Look& look) {
     m_look = look;
     m_strip->setVisible(look.chosen);
     m_copies->setText(look.copies.trimmed());
-    setEnabled(look.filled);
+    setEnabled(look.filled && look.unreadable.isEmpty());
     update();
 }
 
@@ -118,8 +118,15 @@ void PictureCell::paintEvent(QPaintEvent*) {
         painter.drawImage(at, m_look.picture);
         mark = at.bottomLeft() + QPointF(-theme().px(6), theme().px(12));
     } else {
-        drawIcon(painter, QRectF(room).center(),
-                 theme().icon(u"picture"_s, theme().size(IconSize::Box), Theme::Colour::Edge));
+        const QString icon = m_look.waiting ? u"clock"_s : m_look.unreadable.isEmpty() ? u"picture"_s : u"warning"_s;
+        drawIcon(painter, QRectF(room).center(), theme().icon(icon, theme().size(IconSize::Box), Theme::Colour::Edge));
+    }
+    if (!m_look.unreadable.isEmpty()) {
+        painter.setFont(theme().font(Theme::Type::Small));
+        painter.setPen(Theme::Colour::Muted);
+        painter.drawText(QRectF(room.left(), room.center().y() + theme().size(IconSize::Box) / 2.0, room.width(),
+                                room.height() / 2.0 - theme().size(IconSize::Box) / 2.0),
+                         Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap, m_look.unreadable);
     }
     if (m_look.resolution.visible)
         drawResolution(painter, theme(),

@@ -18,6 +18,8 @@ public:
     struct Look {
         QImage picture;
         bool filled = false; // there is a picture, readable or not
+        bool waiting = false;
+        QString unreadable; // the word of a cell that can't be chosen
         bool chosen = false;
         bool inEditor = false;
         QString copies;

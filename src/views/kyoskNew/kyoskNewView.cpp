@@ -2,6 +2,7 @@
 
 #include "common/DrivePath.h"
 #include "views/kit/EditableCombo.h"
+#include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
 #include "views/kyoskNew/LargePicture.h"
 #include "views/kyoskNew/PictureCell.h"
@@ -179,6 +180,11 @@ void kyoskNewView::makeQuestions() {
     m_help->addButton(button(c.helpClose, Role::Main, &kyoskNew::Image6_Click));
     m_help->whenEscaped(toPage(&kyoskNew::Image6_Click));
 
+    m_doorGauge = new Gauge(theme(), this);
+    m_door = new Overlay(theme(), this, {{m_doorGauge, 0, Qt::AlignCenter}});
+    m_door->addButton(button(c.doorBack, Role::Secondary, &kyoskNew::doorBack_Click), Qt::AlignCenter);
+    m_door->whenEscaped(toPage(&kyoskNew::doorBack_Click));
+
     m_compression = new Overlay(theme(), this, {label(c.Label37, "large")});
     m_compression->addButtons(button(c.Command20, Role::Secondary, &kyoskNew::Command20_Click),
                               button(c.Command21, Role::Main, &kyoskNew::Command21_Click));
@@ -291,7 +297,9 @@ void kyoskNewView::renderCells() {
         look.chosen = c.Picture4[i].visible;
         look.inEditor = m_page.openCell() == static_cast<int>(i);
         look.copies = c.Label4[i].text;
-        look.name = LeafName(cell.text);
+        look.name = cell.name;
+        look.waiting = cell.waiting;
+        look.unreadable = cell.unreadable;
         look.resolution = c.resolution[i];
         m_cells[i]->show(look);
         speak(m_cells[i], cell.spoken);
@@ -363,6 +371,8 @@ void kyoskNewView::render() {
     }
     m_branches->setOpen(c.Pic4snifim.visible);
     m_compression->setOpen(c.Picture7.visible);
+    m_doorGauge->show(c.doorShare, QString(), c.doorNote.text);
+    m_door->setOpen(c.doorPanel.visible);
     takeFocus();
 }
 

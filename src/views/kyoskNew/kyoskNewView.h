@@ -8,6 +8,7 @@ class QStackedLayout;
 namespace lumora {
 
 class EditableCombo;
+class Gauge;
 class LargePicture;
 class PictureCell;
 class ResolutionBadge;
@@ -65,6 +66,8 @@ private:
     Overlay* m_branches = nullptr;
     std::array<QPushButton*, 11> m_branchButtons{};
     Overlay* m_compression = nullptr;
+    Overlay* m_door = nullptr;
+    Gauge* m_doorGauge = nullptr;
     int m_focusRequest = 0;
 };
 

@@ -4,6 +4,7 @@
 #include "imaging/files/PictureFile.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
+#include "selection/door/DoorNames.h"
 #include "session/SessionState.h"
 #include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
@@ -293,7 +294,7 @@ void PicturePicker::open(const HostPath& folder) {
         std::error_code kind;
         if (at->is_directory(kind))
             folders.push_back(path);
-        else if ((everyFile() || isJpeg(path)) && at->is_regular_file(kind))
+        else if ((everyFile() || isPicture(path)) && at->is_regular_file(kind))
             files.push_back(path);
     }
     const auto byName = [](const HostPath& a, const HostPath& b) {
@@ -306,7 +307,7 @@ void PicturePicker::open(const HostPath& folder) {
         item->setData(PathRole, QByteArray::fromStdString(path.string()));
         item->setData(FolderRole, isFolder);
         item->setToolTip(nameOf(path));
-        item->setData(PlainRole, !isFolder && !isJpeg(path));
+        item->setData(PlainRole, !isFolder && !isPicture(path));
         if (!isFolder && isJpeg(path))
             m_unread.push_back(m_grid->row(item));
     };
@@ -325,6 +326,10 @@ void PicturePicker::open(const HostPath& folder) {
         m_grid->setCurrentRow(0, QItemSelectionModel::NoUpdate);
     if (!m_unread.empty())
         m_reader.start();
+}
+
+bool PicturePicker::isPicture(const HostPath& path) const {
+    return isPictureName(nameOf(path), m_state.door.everyFormat);
 }
 
 void PicturePicker::readNext() {
@@ -363,7 +368,13 @@ void PicturePicker::activate(const QListWidgetItem* item) {
     if (item->data(FolderRole).toBool())
         open(path);
     else
-        Q_EMIT finished(AnsiCodePage::squeeze(m_files.drives().toDrive(path).text()));
+        Q_EMIT finished(pathText(path));
+}
+
+// Behind the door any name can be ordered.
+QString PicturePicker::pathText(const HostPath& path) const {
+    const QString text = m_files.drives().toDrive(path).text();
+    return m_state.door.any() && !everyFile() ? text : AnsiCodePage::squeeze(text);
 }
 
 void PicturePicker::take() {

@@ -49,6 +49,8 @@ private:
     void activate(const QListWidgetItem* item);
     void take();
     void readNext();
+    bool isPicture(const HostPath& path) const;
+    QString pathText(const HostPath& path) const;
 
     const Theme& m_theme;
     const SessionState& m_state;

@@ -1,0 +1,25 @@
+#pragma once
+
+#include "common/Result.h"
+#include "platform/files/Files.h"
+
+#include <QStringList>
+
+namespace lumora {
+
+struct SessionState;
+
+// The folders of zmany\door: what was made of an order's pictures that are no ordinary JPEG files. The lines of its
+// basket lead there, so that a folder stays as long as its order may still be prepared.
+
+// An empty folder for the order that begins.
+Result<DrivePath> makeDoorFolder(const SessionState& state, const Files& files);
+
+// The way back of an order with these lines is closed.
+void removeDoorFolders(const Files& files, const QStringList& lines);
+
+// Removes the folders to which no order leads that can still be prepared. Only for a data folder in which no other
+// program runs.
+void tidyDoorFolders(const SessionState& state, const Files& files);
+
+} // namespace lumora

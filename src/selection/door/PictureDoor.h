@@ -1,0 +1,107 @@
+#pragma once
+
+#include "common/DoorRules.h"
+#include "common/DrivePath.h"
+#include "common/Result.h"
+#include "door/DoorDecoder.h"
+#include "platform/files/HostPath.h"
+
+#include <QHash>
+#include <QObject>
+#include <QStringList>
+
+#include <deque>
+#include <functional>
+#include <memory>
+#include <utility>
+
+namespace lumora {
+
+class Files;
+
+// Stands between the pictures that a customer brings and the pages: a page lists the customer's own files, and works
+// with a .jpg in the code page in the place of each. That is the file itself where it needs nothing; else a file of the
+// order's folder, which is made in the background, once it is wanted. Lives in one thread.
+class PictureDoor : public QObject {
+    Q_OBJECT
+public:
+    enum class State {
+        InPlace,    // the file itself
+        Waiting,    // not made yet
+        Ready,      // made
+        Unreadable, // no picture, or a damaged one
+        NotMade,    // the disk did not take it; it is tried again when it is wanted again
+    };
+
+    PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rules);
+    ~PictureDoor() override;
+
+    // The folder of the order. A page calls it before anything else.
+    void setFolder(const DrivePath& folder) { m_folder = folder; }
+    const DrivePath& folder() const { return m_folder; }
+    // As built in, each file stands for itself.
+    bool isOpen() const { return m_rules.any(); }
+
+    // The path that the pages work with in the place of a listed one; a path that is one already stays. Reads the
+    // header of a file that it has not seen before.
+    QString worked(const QString& listed);
+    // The customer's own path.
+    QString shown(const QString& worked) const;
+
+    State stateOf(const QString& worked) const;
+    bool isWaiting(const QString& worked) const { return stateOf(worked) == State::Waiting; }
+    bool isUnreadable(const QString& worked) const { return stateOf(worked) == State::Unreadable; }
+    // Why a file is unreadable or was not made.
+    Failure failureOf(const QString& worked) const;
+    // A file that was used in its place can't be shown. Only where all kinds of pictures are offered; as built in such
+    // a file can be chosen.
+    void foundUnreadable(const QString& worked);
+
+    // What is waiting among these is made in this order, and nothing else any more.
+    void want(const QStringList& worked);
+
+    // The order's folder has room for 2 GiB: what was made first goes first, but for what this keeps.
+    void setKept(std::function<bool(const QString& worked)> isKept) { m_isKept = std::move(isKept); }
+
+Q_SIGNALS:
+    // Ready, unreadable or not made.
+    void settled(const QString& worked);
+
+private:
+    struct Picture {
+        QString listed;
+        QString worked;
+        HostPath source;
+        State state = State::InPlace;
+        Failure failure;
+        qint64 bytes = 0;
+        bool inHand = false; // it is being made
+    };
+    struct Desk; // where a thread hands in its result, also when the door has gone
+
+    Picture* find(const QString& worked);
+    const Picture* find(const QString& worked) const;
+    Picture& enter(const QString& listed);
+    DrivePath planned(const DrivePath& listed);
+    void judge(Picture& picture, bool inCodePage);
+    void startNext();
+    void start(Picture& picture);
+    void settle(const QString& worked, const Result<qint64>& made);
+    void makeRoom();
+
+    const Files& m_files;
+    DoorDecoder m_decoder;
+    DoorRules m_rules;
+    DrivePath m_folder;
+    std::deque<Picture> m_pictures;
+    QHash<QString, Picture*> m_byListed;
+    QHash<QString, Picture*> m_byWorked;
+    QHash<QString, QHash<QString, QString>> m_names; // of each folder, by the listed name
+    QStringList m_wanted;
+    QStringList m_made; // the oldest first
+    std::function<bool(const QString&)> m_isKept;
+    int m_running = 0;
+    std::shared_ptr<Desk> m_desk;
+};
+
+} // namespace lumora

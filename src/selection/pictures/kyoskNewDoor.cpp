@@ -1,0 +1,151 @@
+// The page of pictures: those that are no ordinary JPEG files, and are made ready in the background.
+#include "order/DoorFolders.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
+#include "selection/door/PictureDoor.h"
+#include "selection/pictures/kyoskNew.h"
+#include "session/PageChain.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr qsizetype namesInMessage = 8;
+
+} // namespace
+
+// An order that comes back finds its pictures where they were made.
+void kyoskNew::openDoor(const HandOver& before) {
+    m_choice.setWorked([this](const QString& listed) { return m_door->worked(listed); });
+    if (!m_door->isOpen())
+        return;
+    if (before.back && !before.doorFolder.isEmpty()) {
+        m_door->setFolder(before.doorFolder);
+    } else if (const Result<DrivePath> folder = makeDoorFolder(m_state, m_platform.files)) {
+        m_door->setFolder(*folder);
+    } else {
+        m_platform.dialogs.message(folder.failure().message);
+    }
+    m_door->setKept([this](const QString& path) { return m_choice.inBasket(path) || m_choice.page().contains(path); });
+    connect(m_door.get(), &PictureDoor::settled, this, &kyoskNew::pictureSettled);
+}
+
+// The customer's own path.
+DrivePath kyoskNew::shownPath(const QString& path) const {
+    return DrivePath(m_door->shown(path));
+}
+
+QString kyoskNew::unreadableText(const QString& path) const {
+    switch (m_door->failureOf(path).kind) {
+    case Failure::Kind::Unsupported:
+        return m_state.wording(u"סוג קובץ לא מוכר", u"unknown kind of file");
+    case Failure::Kind::TooLarge:
+        return m_state.wording(u"התמונה גדולה מדי", u"this picture is too large");
+    case Failure::Kind::NotFound:
+    case Failure::Kind::AccessDenied:
+        return m_state.wording(u"לא ניתן לקרוא את הקובץ", u"this file can't be read");
+    default:
+        return m_state.wording(u"הקובץ פגום", u"this file is damaged");
+    }
+}
+
+// The page in view first, then the next one, then the rest of what is chosen.
+void kyoskNew::orderPictures() {
+    if (!m_door->isOpen())
+        return;
+    QStringList wanted;
+    if (!m_openWhenMade.isEmpty())
+        wanted += m_openWhenMade;
+    wanted += m_choice.page().items();
+    if (m_choice.hasNextPage())
+        wanted += nextPictures();
+    wanted += m_choice.basket().paths();
+    m_door->want(wanted);
+}
+
+QStringList kyoskNew::nextPictures() const {
+    const FolderPager& folders = m_choice.folders();
+    QStringList next;
+    const int behind = std::min(folders.currentIndex() + cellsOfPage, folders.count());
+    for (int i = std::max(folders.currentIndex(), 0); i < behind; ++i)
+        next += m_door->worked(folders.item(i));
+    return next;
+}
+
+void kyoskNew::pictureSettled(const QString& path) {
+    if (m_handedOver)
+        return;
+    if (m_door->stateOf(path) == PictureDoor::State::NotMade) {
+        if (!std::exchange(m_notMadeTold, true))
+            m_platform.dialogs.message(m_door->failureOf(path).message);
+    } else if (m_door->isUnreadable(path) && m_choice.inBasket(path)) {
+        takeOut(path);
+    }
+    if (waitingPictures() == 0)
+        tellTakenOut();
+    repaint(path);
+    showChoice();
+    const bool opens = m_openWhenMade == path;
+    if (opens)
+        m_openWhenMade.clear();
+    if (!plain() && opens && m_chain.front() == this)
+        choosePicture(List2.find(path));
+    else if (plain() && m_largePath.text() == path)
+        showLarge(m_largePath);
+    if (doorPanel.visible && !waitsForPictures())
+        finish();
+    Q_EMIT changed();
+}
+
+void kyoskNew::takeOut(const QString& path) {
+    m_choice.remove(path);
+    m_takenOut += shownPath(path).leaf();
+}
+
+void kyoskNew::tellTakenOut() {
+    if (m_takenOut.isEmpty())
+        return;
+    QStringList names = m_takenOut.first(std::min(m_takenOut.size(), namesInMessage));
+    if (m_takenOut.size() > namesInMessage)
+        names += m_state.wording(u"ועוד %1", u"and %1 more").arg(m_takenOut.size() - namesInMessage);
+    m_takenOut.clear();
+    const QString told = m_state.wording(u"לא ניתן לקרוא תמונות אלה, והן הוצאו מההזמנה:\n%1",
+                                         u"These pictures can't be read and were taken out of the order:\n%1");
+    m_platform.dialogs.message(told.arg(names.join(u'\n')));
+}
+
+// Of the chosen pictures.
+int kyoskNew::waitingPictures() const {
+    const QStringList chosen = m_choice.basket().paths();
+    return static_cast<int>(
+        std::count_if(chosen.begin(), chosen.end(), [this](const QString& path) { return m_door->isWaiting(path); }));
+}
+
+// The order goes on once the last chosen picture is made.
+bool kyoskNew::waitsForPictures() {
+    if (!m_door->isOpen())
+        return false;
+    if (!doorPanel.visible)
+        orderPictures();
+    const int waiting = waitingPictures();
+    doorPanel.visible = waiting > 0;
+    const int chosen = m_choice.basket().count();
+    doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / chosen : 1;
+    doorNote.text = m_state.wording(u"מכינים את התמונות: %1 מתוך %2", u"Making your pictures ready: %1 of %2")
+                        .arg(chosen - waiting)
+                        .arg(chosen);
+    Q_EMIT changed();
+    return doorPanel.visible;
+}
+
+void kyoskNew::stopWaiting() {
+    doorPanel.visible = false;
+    Q_EMIT changed();
+}
+
+} // namespace lumora

@@ -1,0 +1,207 @@
+#include "editing/editor/BigPics.h"
+#include "editing/editor/tFrmNew.h"
+#include "imaging/files/PictureFile.h"
+#include "order/DoorFolders.h"
+#include "order/OrderFolder.h"
+#include "order/OrderState.h"
+#include "samples/SamplePictureFiles.h"
+#include "selection/door/DoorNames.h"
+#include "selection/pictures/kyoskNew.h"
+#include "session/Workspace.h"
+#include "support/PageRig.h"
+
+#include <QElapsedTimer>
+#include <QGuiApplication>
+
+#include <gtest/gtest.h>
+
+namespace lumora {
+namespace {
+
+TEST(DoorNames, AreInTheCodePageAndThereOnce) {
+    const struct {
+        QStringList names;
+        QStringList behind;
+    } cases[] = {
+        {{u"a.heic"_s, u"a.jpg"_s, u"a.png"_s}, {u"a (2).jpg"_s, u"a.jpg"_s, u"a (3).jpg"_s}},
+        {{u"A.JPG"_s, u"a.webp"_s, u"b.Jpg"_s}, {u"A.JPG"_s, u"a (2).jpg"_s, u"b.jpg"_s}},
+        {{u"cafe.jpeg"_s, u"café.jpg"_s}, {u"cafe.jpg"_s, u"cafe (2).jpg"_s}},
+        {{u"שבת שלום.heic"_s, u"1€.tif"_s}, {u"שבת שלום.jpg"_s, u"1€.jpg"_s}},
+        {{u"写真.png"_s, u"写.jpg"_s, u"a:b*.gif"_s}, {u"picture 1.jpg"_s, u"picture 2.jpg"_s, u"ab.jpg"_s}},
+    };
+    for (const auto& row : cases)
+        EXPECT_EQ(doorNames(row.names), row.behind) << qPrintable(row.names.join(u' '));
+}
+
+const QString doorFolder = u"C:\\2000lumora\\zmany\\door\\1"_s;
+
+class TheDoor : public testing::Test, protected PageRig {
+protected:
+    TheDoor() {
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.maat = u"מבריק"_s;
+        state.shemot.Bord = u"NB"_s;
+        state.Optint = OrderKind::Print;
+        state.door = {true, true, true};
+        state.EnglishTips = 1;
+        machine.platform.doorProgram = LUMORA_DOOR;
+        registerPage<kyoskNew>(PageId::kyoskNew);
+        registerPage<tFrmNew>(PageId::tFrmNew);
+        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
+        registerBare({PageId::hatchala, PageId::Form2, PageId::B3});
+        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
+        makeFolder(u"C:\\p"_path);
+        const QByteArray jpeg = saved(picture, "JPG");
+        put(u"a.jpg"_s, jpeg);
+        put(u"b.jpg"_s, jpegWith(jpeg, exif(6)));
+        put(u"café.jpg"_s, jpeg);
+        put(u"d.heic"_s, heif(picture, {}));
+        put(u"e.png"_s, saved(picture, "PNG").left(200));
+        put(u"f.txt"_s, "no picture");
+        put(u"g.webp"_s, "empty");
+    }
+
+    void put(const QString& name, const QByteArray& bytes) { write(u"C:\\p"_path / name, bytes); }
+
+    kyoskNew& openWithTheFolder() {
+        chain.show(PageId::kyoskNew);
+        auto& page = *chain.find<kyoskNew>();
+        machine.dialogs.picks += u"C:\\p\\a.jpg"_path;
+        page.Image5_Click();
+        return page;
+    }
+    void waitUntil(const std::function<bool()>& done) {
+        QElapsedTimer clock;
+        for (clock.start(); !done() && clock.elapsed() < 60'000;)
+            QGuiApplication::processEvents(QEventLoop::AllEvents, 50);
+        ASSERT_TRUE(done());
+    }
+    void waitForCells(const kyoskNew& page) {
+        waitUntil([&page] {
+            const auto& cells = page.controls().Picture1;
+            return std::none_of(cells.begin(), cells.end(), [](const CellPicture& cell) { return cell.waiting; });
+        });
+    }
+    QStringList made() const {
+        return machine.files.collect(DrivePath(doorFolder), Files::Depth::WithSubfolders)
+            .replaceInStrings(doorFolder, QString());
+    }
+
+    const QImage picture = patches(48, 32);
+};
+
+TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted) {
+    kyoskNew& page = openWithTheFolder();
+    const kyoskNewControls& shown = page.controls();
+    EXPECT_EQ(shown.pictureCount.text, u"6 pictures"_s);
+    EXPECT_TRUE(shown.Picture1[3].waiting) << "its turn comes while the customer looks";
+    EXPECT_EQ(shown.Picture1[5].unreadable, u"unknown kind of file"_s) << "told by its header";
+    waitForCells(page);
+    const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.png"_s, u"g.webp"_s};
+    for (std::size_t cell = 0; cell < 6; ++cell) {
+        EXPECT_EQ(shown.Picture1[cell].name, names[qsizetype(cell)]);
+        EXPECT_EQ(shown.Picture1[cell].bitmap.isNull(), cell > 3) << cell;
+    }
+    EXPECT_GT(shown.Picture1[1].bitmap.height(), shown.Picture1[1].bitmap.width()) << "held upright";
+    EXPECT_EQ(shown.Picture1[4].unreadable, u"this file is damaged"_s);
+    EXPECT_EQ(shown.List2.item(0), u"C:\\p\\a.jpg"_s) << "used where it lies";
+
+    page.Picture1_Click(4);
+    page.Command12_Click(5);
+    EXPECT_TRUE(shown.List1.isEmpty());
+    page.Picture1_Click(3);
+    EXPECT_EQ(shown.Label2.text, u"C:\\p\\d.heic"_s);
+    page.Command24_Click(); // the whole folder
+    page.Image7_Click();
+    page.Command8_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::Form2);
+    QStringList printed;
+    for (const QString& line : state.handOver.lines) {
+        printed += LeafName(line);
+        EXPECT_TRUE(machine.files.fileExists(DrivePath(line.mid(9)))) << qPrintable(line);
+    }
+    EXPECT_EQ(printed, QStringList({u"d.jpg"_s, u"a.jpg"_s, u"b.jpg"_s, u"cafe.jpg"_s}));
+
+    // Back from the preparation all is as it was; left for another order nothing stays.
+    state.handOver.back = true;
+    chain.unload(PageId::kyoskNew);
+    EXPECT_EQ(made().size(), 3);
+    chain.show(PageId::kyoskNew);
+    auto& again = *chain.find<kyoskNew>();
+    waitForCells(again);
+    EXPECT_EQ(again.controls().Label7.text, u"4"_s);
+    EXPECT_EQ(again.controls().Picture1[3].name + again.controls().Label4[3].text, u"d.heic1"_s);
+    chain.unload(PageId::kyoskNew);
+    waitUntil([this] { return !machine.files.folderExists(DrivePath(doorFolder)); });
+}
+
+TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
+    for (int i = 0; i < 14; ++i)
+        put(u"z%1.png"_s.arg(i), saved(picture, "PNG").left(i == 13 ? 300 : 1000000));
+    kyoskNew& page = openWithTheFolder();
+    page.Command24_Click();
+    page.Image7_Click();
+    EXPECT_TRUE(page.controls().doorPanel.visible && !page.controls().Frame4.visible);
+    page.doorBack_Click();
+    EXPECT_FALSE(page.controls().doorPanel.visible);
+    page.Image7_Click();
+    EXPECT_EQ(page.controls().doorNote.text.left(26), u"Making your pictures ready"_s);
+    waitUntil([&page] { return page.controls().Frame4.visible; });
+    EXPECT_FALSE(page.controls().doorPanel.visible);
+    EXPECT_EQ(page.controls().Label20.text, u"17"_s);
+    EXPECT_EQ(machine.dialogs.messages,
+              QStringList(u"These pictures can't be read and were taken out of the order:\ne.png\nz13.png"_s));
+}
+
+TEST_F(TheDoor, OpensAPictureInTheEditorOnceItIsMade) {
+    state.Optint = OrderKind::EditedPrint;
+    kyoskNew& page = openWithTheFolder();
+    page.Picture1_Click(3);
+    waitUntil([this] { return chain.front() == chain.find<tFrmNew>(); });
+    EXPECT_TRUE(state.edit.PicturePath.text().endsWith(u"\\d.jpg"_s));
+    EXPECT_EQ(page.openCell(), 3);
+}
+
+TEST_F(TheDoor, OffersAndUsesJpegFilesAsTheyLieUnlessTheLabAsksForMore) {
+    state.door = {};
+    kyoskNew& asBuiltIn = openWithTheFolder();
+    EXPECT_EQ(asBuiltIn.controls().List2.items(),
+              QStringList({u"C:\\p\\a.jpg"_s, u"C:\\p\\b.jpg"_s, u"C:\\p\\caf?.jpg"_s}));
+    EXPECT_FALSE(machine.files.folderExists(DrivePath(doorFolder)));
+    chain.unload(PageId::kyoskNew);
+    state.door.upright = true;
+    put(u"a.jpg"_s, jpegWith(saved(picture, "JPG"), {}, adobeProfile()));
+    kyoskNew& upright = openWithTheFolder();
+    const QStringList paths = upright.controls().List2.items();
+    EXPECT_EQ(paths.first(), u"C:\\p\\a.jpg"_s) << "its colours are as stored";
+    EXPECT_TRUE(paths.value(1).startsWith(doorFolder) && paths.size() == 3);
+}
+
+TEST_F(TheDoor, KeepsTheFoldersOfOrdersThatMayStillBePreparedAndNoOther) {
+    for (int i = 1; i <= 4; ++i) {
+        const auto folder = makeDoorFolder(state, machine.files);
+        ASSERT_TRUE(folder);
+        EXPECT_EQ(folder->leaf(), QString::number(i));
+        write(*folder / u"x.jpg", "x");
+    }
+    makeFolder(u"C:\\2000lumora\\!!000\\a"_path);
+    const auto keep = [this](OrderState::Phase phase, OrderState::Way way) {
+        OrderState order;
+        order.number = u"7"_s;
+        order.phase = phase;
+        order.way = way;
+        order.items = {u"1 1015GNBC:\\2000lumora\\zmany\\door\\2\\k\\a.jpg"_s,
+                       u"1 1015GNBZ:\\card\\2000lumora\\zmany\\door\\4\\k\\a.jpg"_s};
+        EXPECT_TRUE(WriteOrderState(machine.files, OrderFolder(u"C:\\2000lumora\\!!000\\a"_path), order));
+        tidyDoorFolders(state, machine.files);
+        return machine.files.folders(u"C:\\2000lumora\\zmany\\door"_path);
+    };
+    EXPECT_EQ(keep(OrderState::Phase::Preparing, OrderState::Way::Station), QStringList(u"2"_s));
+    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Ftp), QStringList(u"2"_s));
+    removeDoorFolders(machine.files, {u"1 1015GNBD:\\2000lumora\\zmany\\door\\2\\k\\a.jpg"_s});
+    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Ftp), QStringList(u"2"_s)) << "a customer's card";
+    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Station), QStringList());
+}
+
+} // namespace
+} // namespace lumora
