@@ -103,6 +103,7 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
         EXPECT_EQ(shown.Picture1[cell].bitmap.isNull(), cell > 3) << cell;
     }
     EXPECT_GT(shown.Picture1[1].bitmap.height(), shown.Picture1[1].bitmap.width()) << "held upright";
+    EXPECT_TRUE(shown.resolution[3].visible);
     EXPECT_EQ(shown.Picture1[4].unreadable, u"this file is damaged"_s);
     EXPECT_EQ(shown.List2.item(0), u"C:\\p\\a.jpg"_s) << "used where it lies";
 

@@ -148,6 +148,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     // The keys whose example is not the built-in value.
     Deployment expected;
     expected.Careful = expected.keptFtpSession = true;
+    expected.door = {true, true, true};
     expected.OperatorArea = false;
     expected.profile.PriceListUrl = u"http://www.lumora.example/album_pricelist"_s; // else it follows the site
     expected.albumTail = AlbumTail::Photographer;

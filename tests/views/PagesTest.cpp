@@ -44,7 +44,8 @@ TEST_P(PageLook, HasNoFaultWithAWholeFolderAndTheShopsOfACoupon) {
         u"[Switches]\nCoupon = yes\nDeepCompression = ask\nFitPage = yes\n[Paper]\nQuickSizes = 10/15, 13/18, "
         u"20/30\n[Branches]\n"
         "Branch1 = Haifa\nBranch1Name = Haifa Carmel\nBranch1Address1 = 5 Herzl Street\nBranch1Phone = 04-5550000\n"
-        "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n[Guards]\nCareful = yes\n"_s);
+        "Branch2 = Eilat\nBranch3 = Tel Aviv\nBranch4 = Jerusalem\nBranch5 = Beer Sheva\n[Guards]\nCareful = yes\n[Door]\nFormats = all\n"_s);
+    walk.write(walk.pictureFolder() / u"A film of summer.heic", "no picture, and left out of the whole folder");
     walk.program().state().coupon.HaKoopon = 1;
     go(walk, toMenu + u"Image1(2) "_s + toOptions);
     const auto& sizes = walk.page<nnn>(PageId::nnn).controls().Combo1.rows;

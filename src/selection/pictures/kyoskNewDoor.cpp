@@ -88,6 +88,7 @@ void kyoskNew::pictureSettled(const QString& path) {
     }
     if (waitingPictures() == 0)
         tellTakenOut();
+    m_resolution.look(path);
     repaint(path);
     showChoice();
     const bool opens = m_openWhenMade == path;
@@ -139,7 +140,8 @@ bool kyoskNew::waitsForPictures() {
     doorNote.text = m_state.wording(u"מכינים את התמונות: %1 מתוך %2", u"Making your pictures ready: %1 of %2")
                         .arg(chosen - waiting)
                         .arg(chosen);
-    Q_EMIT changed();
+    if (doorPanel.visible)
+        Q_EMIT changed();
     return doorPanel.visible;
 }
 

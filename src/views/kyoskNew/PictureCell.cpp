@@ -89,14 +89,14 @@ void PictureCell::keyPressEvent(QKeyEvent* event) {
 void PictureCell::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setLayoutDirection(layoutDirection());
-    const bool lively = underMouse() && m_look.filled;
+    const bool lively = underMouse() && isEnabled();
     const QRectF card = drawCard(painter, rect(),
                                  m_look.inEditor           ? Theme::Colour::Sun
                                  : m_look.chosen || lively ? Theme::Colour::Primary
                                                            : Theme::Colour::Line,
-                                 m_look.chosen   ? Theme::Colour::PrimarySoft
-                                 : m_look.filled ? Theme::Colour::Surface
-                                                 : Theme::Colour::Paper,
+                                 m_look.chosen                                  ? Theme::Colour::PrimarySoft
+                                 : m_look.filled && m_look.unreadable.isEmpty() ? Theme::Colour::Surface
+                                                                                : Theme::Colour::Paper,
                                  m_look.chosen || m_look.inEditor ? theme().thick()
                                  : lively                         ? theme().hair()
                                                                   : 1,

@@ -363,6 +363,8 @@ void kyoskNewView::render() {
         breakLong(*answer);
     m_leave->setOpen(c.Frame3.visible);
     m_help->setOpen(c.Frame2.visible);
+    if (c.Frame4.visible && !m_closing->isOpen())
+        m_branches->setOpen(false); // comes in front again, with the keyboard
     renderClosing();
     // The panel opens on the first branch there is.
     for (std::size_t i = m_branchButtons.size(); i-- > 0;) {
