@@ -1,10 +1,14 @@
 #pragma once
 
+#include <QString>
 #include <QStringView>
 
+// Which files customers are offered as pictures, by their endings alone and in any letter case: .jpg, or all that
+// DoorRules::everyFormat lets through.
 namespace lumora {
 
-// By the ending alone, in any letter case: whether customers are offered the file as a picture.
-bool isPictureFile(QStringView name);
+bool isPictureFile(QStringView name, bool everyFormat = false);
+// The same as patterns for the names of a folder: "*.jpg;*.jpeg".
+QString picturePatterns(bool everyFormat);
 
 } // namespace lumora

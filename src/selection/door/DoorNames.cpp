@@ -5,16 +5,11 @@
 
 #include <QSet>
 
-#include <algorithm>
-
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
 namespace {
-
-constexpr const char16_t* endings[] = {u".jpg",  u".jpeg", u".jpe",  u".png", u".heic", u".heif",
-                                       u".avif", u".webp", u".tiff", u".tif", u".bmp",  u".gif"};
 
 bool isInCodePage(const QString& text) {
     return !HasQuestionMark(AnsiCodePage::squeeze(text));
@@ -44,22 +39,6 @@ QString inCodePage(const QString& text) {
 }
 
 } // namespace
-
-QString picturePatterns(bool everyFormat) {
-    if (!everyFormat)
-        return u"*.jpg"_s;
-    QStringList patterns;
-    for (const char16_t* ending : endings)
-        patterns += u'*' + QString::fromUtf16(ending);
-    return patterns.join(u';');
-}
-
-bool isPictureName(const QString& name, bool everyFormat) {
-    const auto ends = [&](const char16_t* ending) {
-        return name.endsWith(QString::fromUtf16(ending), Qt::CaseInsensitive);
-    };
-    return everyFormat ? std::any_of(std::begin(endings), std::end(endings), ends) : ends(u".jpg");
-}
 
 QStringList doorNames(const QStringList& names) {
     QSet<QString> taken;

@@ -5,11 +5,6 @@
 
 namespace lumora {
 
-// The patterns of the files that are offered as pictures (platform/files/Files.h).
-QString picturePatterns(bool everyFormat);
-// True for the name of such a file.
-bool isPictureName(const QString& name, bool everyFormat);
-
 // The name of each picture of a folder behind the door, in the order of names: its own with the ending .jpg. The lab
 // prints under these names, so that each is in the code page and there once, whatever the case of its letters: a .jpg
 // file keeps its name, and another one that would have it gets "a (2).jpg". Accents outside the code page are dropped,

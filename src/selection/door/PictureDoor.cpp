@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/FixedText.h"
+#include "common/PictureName.h"
 #include "platform/files/Files.h"
 #include "selection/door/DoorNames.h"
 

@@ -2,6 +2,7 @@
 
 #include "common/DrivePath.h"
 #include "common/FixedText.h"
+#include "common/PictureName.h"
 #include "editing/ResolutionWords.h"
 #include "editing/editor/tFrmNew.h"
 #include "order/CouponLimit.h"
@@ -9,7 +10,6 @@
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
-#include "selection/door/DoorNames.h"
 #include "selection/door/PictureDoor.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"

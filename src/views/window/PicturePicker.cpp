@@ -1,10 +1,10 @@
 #include "views/window/PicturePicker.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/PictureName.h"
 #include "imaging/files/PictureFile.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
-#include "selection/door/DoorNames.h"
 #include "session/SessionState.h"
 #include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
@@ -329,7 +329,7 @@ void PicturePicker::open(const HostPath& folder) {
 }
 
 bool PicturePicker::isPicture(const HostPath& path) const {
-    return isPictureName(nameOf(path), m_state.door.everyFormat);
+    return isPictureFile(nameOf(path), m_state.door.everyFormat);
 }
 
 void PicturePicker::readNext() {
