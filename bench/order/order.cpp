@@ -101,6 +101,7 @@ public:
                      m_pump,
                      m_machine.volume,
                      m_machine.instances,
+                     m_machine.cards,
                      {}}
         , m_chain(m_pump) {
         const HostPath folder = makeFolder("C:\\pics");

@@ -15,6 +15,7 @@
 #include "platform/files/StatVolume.h"
 #include "platform/line/PocoInternet.h"
 #include "platform/line/SmtpMail.h"
+#include "platform/media/SystemMedia.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/lab/LabFile.h"
@@ -53,7 +54,7 @@ HostPath doorProgram() {
 
 // Each member uses only those above it.
 struct Program::Parts {
-    Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line)
+    Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line, Cards::Source media)
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
@@ -61,13 +62,16 @@ struct Program::Parts {
         , fileSystem(drives)
         , volume(fileSystem, dataFolder, NetworkCards(),
                  [](const Failure& why) { warn(u"the mark of the data folder can't be kept: %1"_s.arg(why.message)); })
+        , cards(deployment.watchedCards ? std::move(media) : Cards::Source())
         , internet({}, deployment.ftpType)
         , shell(drives)
         , chain(pump)
         , window(chain, state)
-        , dialogs(window, state, files)
+        , dialogs(window, state, files, cards, clock)
         , platform{files,     dialogs,      line ? *line : internet, mail, shell, clock, pump, volume,
-                   instances, doorProgram()} {
+                   instances, cards, doorProgram()} {
+        // A medium has its letter before any page hears of it.
+        QObject::connect(&cards, &Cards::changed, &window, [this] { drives.refreshMedia(); });
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
             const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);
@@ -84,6 +88,7 @@ struct Program::Parts {
     Instances instances;
     StatVolume fileSystem;
     MarkedVolume volume;
+    Cards cards;
     SystemClock clock;
     QtEventPump pump;
     PocoInternet internet;
@@ -167,7 +172,8 @@ Result<void> Program::start() {
     if (!run.another())
         removeLeftovers(dataFolder, startTime);
 
-    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet);
+    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet,
+                                      m_options.media ? m_options.media : systemMedia);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     registerViews(parts.window, parts.chain, parts.state, parts.files);

@@ -2,6 +2,7 @@
 
 #include "common/Result.h"
 #include "platform/files/HostPath.h"
+#include "platform/media/Cards.h"
 
 #include <QSize>
 
@@ -24,6 +25,7 @@ struct ProgramOptions {
     bool fullScreen = false;
     bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
     Internet* internet = nullptr; // replaces the machine's own line
+    Cards::Source media;          // replaces the machine's own media, where the lab has them watched
 };
 
 // One run of the program: the session, the machine, the chain of pages and the window. Needs an Application (in

@@ -4,6 +4,7 @@
 
 namespace lumora {
 
+class Cards;
 class Clock;
 class Dialogs;
 class EventPump;
@@ -25,6 +26,7 @@ struct Platform {
     EventPump& pump;
     const Volume& volume;
     const Instances& instances;
+    Cards& cards;
     HostPath doorProgram; // lumora-door, which decodes what is no ordinary JPEG; where it is missing nothing is decoded
 };
 

@@ -1,5 +1,6 @@
 #include "order/EditRecord.h"
 #include "selection/Basket.h"
+#include "selection/CardWords.h"
 #include "selection/FolderPager.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
@@ -214,6 +215,34 @@ TEST(APrintGrade, goesByThePixelCountAlone) {
           Case{{65500, 65500}, PrintGrade::Good, u"  איכות  65500 / 65500"_s}}) {
         EXPECT_EQ(printGrade(c.size), c.grade);
         EXPECT_EQ(printGradeText(c.grade, c.size, false), c.text);
+    }
+}
+
+TEST(ACard, isOfferedInTheWordsOfItsLanguage) {
+    using enum Medium::Kind;
+    const QDate today(2026, 11, 21);
+    const struct {
+        Medium::Kind kind;
+        std::optional<CardSummary> card;
+        QString english;
+        QString hebrew;
+    } cases[] = {
+        {SdCard, CardSummary{true, 214, false, today, {}, {}}, u"SD card: 214 pictures · newest today"_s,
+         u"כרטיס SD: 214 תמונות · החדשה מהיום"_s},
+        {Stick, CardSummary{true, 1, false, today.addDays(-1), {}, {}}, u"USB stick: 1 picture · newest yesterday"_s,
+         u"התקן USB: תמונה אחת · החדשה מאתמול"_s},
+        {Other, CardSummary{true, 9, true, today.addDays(-2), {}, {}},
+         u"EOS: more than 9 pictures · newest 19.11.2026"_s, u"EOS: יותר מ-9 תמונות · החדשה מ-19.11.2026"_s},
+        {Card, CardSummary{true, 0, false, {}, {}, {}}, u"Memory card: no pictures"_s, u"כרטיס זיכרון: אין תמונות"_s},
+        {Card, CardSummary(), u"Memory card: can't be read"_s, u"כרטיס זיכרון: לא ניתן לקריאה"_s},
+        {Card, {}, u"Memory card: counting the pictures…"_s, u"כרטיס זיכרון: סופר את התמונות…"_s},
+    };
+    for (const auto& [kind, card, english, hebrew] : cases) {
+        for (const bool inEnglish : {true, false}) {
+            const CardWords words = cardWords({{{}, kind, u"EOS"_s, {}}, card}, today, inEnglish);
+            EXPECT_EQ(words.head + u": "_s + words.note, inEnglish ? english : hebrew);
+            EXPECT_EQ(words.opens, card && card->pictures > 0);
+        }
     }
 }
 

@@ -8,6 +8,7 @@
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
 #include "platform/line/Mail.h"
+#include "platform/media/Cards.h"
 #include "support/DrivePathLiteral.h"
 
 #include <QStringList>
@@ -133,7 +134,7 @@ public:
         : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
         , instances(drives.dataFolder())
-        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, {}} {}
+        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, cards, {}} {}
 
     QTemporaryDir folder;
     Drives drives;
@@ -146,6 +147,7 @@ public:
     FixedVolume volume;
     NoInternet noInternet;
     RecordedMail mail;
+    Cards cards;
     Platform platform;
 
 private:

@@ -126,7 +126,7 @@ QString clippedText(const QWidget& widget) {
 
 } // namespace
 
-Walk::Walk(QSize size, const QString& labSettings, Internet* line) {
+Walk::Walk(QSize size, const QString& labSettings, Internet* line, Cards::Source media) {
     const HostPath root(m_folder.path().toStdString());
     std::filesystem::create_directories(root / "Pictures");
     QFile lab(m_folder.filePath(u"lab.ini"_s));
@@ -140,6 +140,7 @@ Walk::Walk(QSize size, const QString& labSettings, Internet* line) {
     options.dataFolder = root / "drive_c";
     options.windowSize = size;
     options.internet = line;
+    options.media = std::move(media);
     m_program = std::make_unique<Program>(std::move(options));
     const Result<void> started = m_program->start();
     EXPECT_TRUE(started.ok()) << (started ? "" : qPrintable(started.failure().message));
@@ -147,8 +148,8 @@ Walk::Walk(QSize size, const QString& labSettings, Internet* line) {
     settle(60);
 }
 
-Walk::Walk(const Screen& screen, const QString& labSettings, Internet* line)
-    : Walk(screen.size, labSettings, line) {
+Walk::Walk(const Screen& screen, const QString& labSettings, Internet* line, Cards::Source media)
+    : Walk(screen.size, labSettings, line, std::move(media)) {
     if (screen.english)
         press(u"hatchala"_s, u"Check1"_s);
 }

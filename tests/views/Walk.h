@@ -39,9 +39,10 @@ inline const QString toPictures = u"Check1 Command3>kyoskNew "_s;
 // are visible, enabled and not covered. A step that fails is a failure of the test that takes it.
 class Walk {
 public:
-    explicit Walk(QSize size, const QString& labSettings = {}, Internet* line = nullptr);
+    explicit Walk(QSize size, const QString& labSettings = {}, Internet* line = nullptr, Cards::Source media = {});
     // In that language, turned to on the start page.
-    explicit Walk(const Screen& screen, const QString& labSettings = {}, Internet* line = nullptr);
+    explicit Walk(const Screen& screen, const QString& labSettings = {}, Internet* line = nullptr,
+                  Cards::Source media = {});
     ~Walk();
 
     Program& program() { return *m_program; }

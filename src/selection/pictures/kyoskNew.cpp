@@ -75,6 +75,7 @@ void kyoskNew::load() {
         takeBack(before);
     else
         m_state.BranchChoice.clear();
+    watchCards();
     showChoice();
     if (plain())
         return;
@@ -118,6 +119,7 @@ void kyoskNew::showChoice() {
     Image16.enabled = m_choice.hasNextPage();
     for (int cell = 0; cell < cellsOfPage; ++cell)
         showCell(cell);
+    showCards();
     Q_EMIT changed();
 }
 

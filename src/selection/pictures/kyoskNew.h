@@ -2,6 +2,7 @@
 
 #include "order/MailAddressGuard.h"
 #include "platform/files/Files.h"
+#include "platform/media/Cards.h"
 #include "selection/FinishRule.h"
 #include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
@@ -14,6 +15,7 @@
 #include <functional>
 #include <initializer_list>
 #include <memory>
+#include <optional>
 
 namespace lumora {
 
@@ -53,6 +55,7 @@ public:
 
     // Finding pictures.
     void Image5_Click() { addFolder(); }
+    void cardOffer_Click() { openCard(); }
     void Image16_Click() { turnTo(&PictureChoice::nextPage); }
     void Image15_Click() { turnTo(&PictureChoice::previousPage); }
     void Command14_Click() { turnTo(&PictureChoice::chosenPage); }
@@ -136,9 +139,13 @@ private:
 
     void addFolder();
     void pickFolder();
+    bool refusesName(const DrivePath& picture);
     void showFolderOf(const DrivePath& picture);
     void takeFolderOf(const DrivePath& picture);
     void showFolderOffer();
+    void watchCards();
+    void showCards();
+    void openCard();
     void turnPage(const std::function<void()>& step);
     void showPictureCount();
     void turnTo(void (PictureChoice::*page)());
@@ -227,6 +234,8 @@ private:
     PictureChoice m_choice;
     OrderResolution m_resolution;
     FileList File1;
+    std::optional<Cards::Watch> m_watch;
+    DrivePath m_cardPicture; // the newest of the card that is offered; empty when none can be opened
     Ticker Timer1;
     Ticker Timer2;
     int m_cellSize = 115;   // logical pixels

@@ -81,11 +81,8 @@ void kyoskNew::pickFolder() {
     Pic4Brose.visible = false;
     Q_EMIT changed();
 
-    // A picture whose own name is outside the code page fails alone, when the order is prepared.
-    if (plain() && !m_door->isOpen() && HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text())) {
-        m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
+    if (refusesName(picture))
         return;
-    }
     if (picture.isEmpty()) {
         if (!m_choice.folders().isEmpty()) {
             m_choice.markPage();
@@ -94,6 +91,15 @@ void kyoskNew::pickFolder() {
         return;
     }
     showFolderOf(picture);
+}
+
+// A picture whose own name is outside the code page fails alone, when the order is prepared.
+bool kyoskNew::refusesName(const DrivePath& picture) {
+    if (!plain() || m_door->isOpen() ||
+        !HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text()))
+        return false;
+    m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
+    return true;
 }
 
 void kyoskNew::showFolderOf(const DrivePath& picture) {

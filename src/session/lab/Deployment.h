@@ -31,6 +31,7 @@ struct Deployment {
     bool SplitPage = false;
     std::int16_t SugTzad = 40;
     bool Careful = false;
+    bool watchedCards = false; // cards and sticks show themselves; else they are found by looking
     bool OperatorArea = true;
     bool OperatorEditor = false;
     AlbumTail albumTail = AlbumTail::Customer;

@@ -242,6 +242,8 @@ std::vector<Row> rows() {
         {"Door", "Upright", yesNo(at(&DoorRules::upright), true, false)},
         {"Door", "Colour",
          words<bool>(at(&DoorRules::srgb), u"stored or sRGB"_s, {{u"stored"_s, false}, {u"sRGB"_s, true}})},
+        {"Door", "Cards",
+         words<bool>(at(&D::watchedCards), u"stored or watched"_s, {{u"stored"_s, false}, {u"watched"_s, true}})},
 
         {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
         {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},

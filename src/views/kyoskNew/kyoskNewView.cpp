@@ -1,6 +1,7 @@
 #include "views/kyoskNew/kyoskNewView.h"
 
 #include "common/DrivePath.h"
+#include "views/kit/CardOffer.h"
 #include "views/kit/EditableCombo.h"
 #include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
@@ -58,6 +59,9 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     frame().content()->addLayout(makeTopRow());
     auto* body = new QWidget(this);
     m_body = new QStackedLayout(body);
+    m_card = new CardOffer(theme, this);
+    bind(m_card, c.cardOffer);
+    connect(m_card, &QAbstractButton::clicked, &page, &kyoskNew::cardOffer_Click);
     m_body->addWidget(makeEmpty());
     QWidget* grid = makeGrid();
     m_side = makeSide();
@@ -125,6 +129,7 @@ QWidget* kyoskNewView::makeEmpty() {
                        centred(label(c.emptyHead, "title")),
                        centred(label(c.Label25)),
                        {m_firstFolder, 0, Qt::AlignCenter},
+                       m_cardPlaces[0] = inRow(Space::None),
                        Item::room()});
     return card.frame;
 }
@@ -155,7 +160,8 @@ QWidget* kyoskNewView::makeSide() {
         offer.column->addWidget(answer);
     }
     QPushButton* branch = button(c.Image33, Role::Plain, &kyoskNew::Image33_Click, u"shop"_s);
-    return inBox(inColumn(Space::Small, {{picture.frame, 1}, offer.frame, branch}));
+    m_cardPlaces[1] = inRow(Space::None);
+    return inBox(inColumn(Space::Small, {m_cardPlaces[1], {picture.frame, 1}, offer.frame, branch}));
 }
 
 void kyoskNewView::makeBars() {
@@ -339,6 +345,17 @@ void kyoskNewView::renderFolder() {
     m_folder->setText(line);
 }
 
+// One control, at the place that the body in view has for it.
+void kyoskNewView::renderCard() {
+    QBoxLayout* place = m_cardPlaces[m_page.showsCells() ? 1 : 0];
+    if (place->isEmpty()) {
+        place->addWidget(m_card, 0, m_page.showsCells() ? Qt::Alignment() : Qt::AlignCenter);
+        m_card->setSize(m_page.showsCells() ? CardOffer::Size::Slim : CardOffer::Size::Large);
+    }
+    m_card->setNote(c.cardNote.text);
+    speak(m_card, c.cardNote.text.isEmpty() ? c.cardOffer.text : c.cardOffer.text + u", "_s + c.cardNote.text);
+}
+
 bool kyoskNewView::leave() {
     m_page.Image10_Click();
     return true;
@@ -352,6 +369,7 @@ void kyoskNewView::render() {
         QTimer::singleShot(0, this, &kyoskNewView::fitCells);
     }
     renderFolder();
+    renderCard();
     renderCells();
     m_large->show(c.Picture2);
     m_largeResolution->display(c.largeResolution);

@@ -7,6 +7,7 @@ class QStackedLayout;
 
 namespace lumora {
 
+class CardOffer;
 class EditableCombo;
 class Gauge;
 class LargePicture;
@@ -38,6 +39,7 @@ private:
     void makeBranchPanel();
     void pointAtBranch(const QObject* widget);
     void renderFolder();
+    void renderCard();
     void renderCells();
     void renderClosing();
     void fitCells();
@@ -51,6 +53,8 @@ private:
     std::array<QPushButton*, 3> m_offerButtons{};
     QLabel* m_folder = nullptr;
     QPushButton* m_firstFolder = nullptr;
+    CardOffer* m_card = nullptr;
+    std::array<QBoxLayout*, 2> m_cardPlaces{}; // of the first step, beside the cells
     QPushButton* m_previous = nullptr;
     QPushButton* m_next = nullptr;
     Overlay* m_leave = nullptr;

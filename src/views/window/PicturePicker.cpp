@@ -3,12 +3,17 @@
 #include "common/AnsiCodePage.h"
 #include "common/PictureName.h"
 #include "imaging/files/PictureFile.h"
+#include "platform/Machine.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
+#include "selection/CardWords.h"
 #include "session/SessionState.h"
+#include "views/kit/CardOffer.h"
 #include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
 
+#include <QDateTime>
+#include <QFileInfo>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QStandardPaths>
@@ -22,7 +27,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-enum ItemRole { PathRole = Qt::UserRole, FolderRole, PictureRole, PlainRole, BrokenRole };
+enum ItemRole { PathRole = Qt::UserRole, FolderRole, PictureRole, PlainRole, BrokenRole, HeadingRole };
 
 // One cell of the grid: the picture or the folder's sign, and the name below it.
 class CellPainter : public QStyledItemDelegate {
@@ -31,12 +36,25 @@ public:
         : QStyledItemDelegate(parent)
         , m_theme(theme) {}
 
-    QSize sizeHint(const QStyleOptionViewItem&, const QModelIndex&) const override {
+    QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override {
+        const auto* view = qobject_cast<const QAbstractItemView*>(option.widget);
+        if (view && index.data(HeadingRole).toBool())
+            return {view->viewport()->width() - 1, m_theme.px(40)};
         return {m_theme.px(160), m_theme.px(172)};
     }
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
         painter->save();
+        if (index.data(HeadingRole).toBool()) {
+            const int inset = m_theme.size(Space::Small);
+            painter->setFont(m_theme.font(Theme::Type::Strong));
+            painter->setPen(Theme::Colour::Ink);
+            painter->setLayoutDirection(option.direction);
+            painter->drawText(option.rect.adjusted(inset, 0, -inset, -m_theme.size(Space::Tight)),
+                              Qt::AlignBottom | Qt::AlignLeft, index.data(Qt::DisplayRole).toString());
+            painter->restore();
+            return;
+        }
         const bool chosen = option.state & QStyle::State_Selected;
         const bool focused = option.state & QStyle::State_HasFocus;
         const int inset = m_theme.size(Space::Tight);
@@ -106,7 +124,7 @@ QString nameOf(const HostPath& path) {
 }
 
 bool isJpeg(const HostPath& path) {
-    return toText(path.extension()).compare(u".jpg", Qt::CaseInsensitive) == 0;
+    return isPictureFile(nameOf(path));
 }
 
 // The picker opens at the first place that holds anything, not at the last folder: that may be another customer's.
@@ -119,12 +137,14 @@ bool holdsAnything(const HostPath& folder) {
 } // namespace
 
 PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                             const QString& prompt, const DrivePath& initialFolder, const QString& title,
-                             Dialogs::Offer offer)
+                             Cards& cards, const Clock& clock, const QString& prompt, const DrivePath& initialFolder,
+                             const QString& title, Dialogs::Offer offer)
     : Overlay(theme, parent)
     , m_theme(theme)
     , m_state(state)
     , m_files(files)
+    , m_cards(cards)
+    , m_clock(clock)
     , m_offer(offer) {
     setObjectName(u"picturePicker"_s);
     setAccessibleName(title.isEmpty() ? prompt : title);
@@ -140,6 +160,8 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
                             u"Select only one image of a folder and the program will show you all the images"_s);
     add(*column(), {named(words("title", isolated(prompt.trimmed())), u"pickerPrompt"_s),
                     named(words("muted", isolated(guide)), u"pickerGuide"_s)});
+    if (watchesCards())
+        addRow({makeCardRow()}, Space::Normal);
     m_places = places(initialFolder);
     QLayout* side = makePlaces();
     m_up = wordButton(u"pickerUp"_s, "plain", state.wording(u"תיקייה מעל"_s, u"Folder above"_s),
@@ -171,7 +193,7 @@ QLayout* PicturePicker::makePlaces() {
     for (std::size_t i = 0; i < m_places.size(); ++i) {
         const Place& place = m_places[i];
         QPushButton* button =
-            wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(m_places[i].folder); });
+            wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(startOf(m_places[i].folder)); });
         setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
         const int room = m_theme.size(Extent::Field);
         button->setText(QChar(0xA0) +
@@ -205,7 +227,7 @@ void PicturePicker::makeGrid() {
     m_grid->setViewMode(QListView::IconMode);
     m_grid->setMovement(QListView::Static);
     m_grid->setResizeMode(QListView::Adjust);
-    m_grid->setUniformItemSizes(true);
+    m_grid->setUniformItemSizes(!watchesCards()); // a heading takes a row
     m_grid->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     m_grid->setProperty("ownRing", true);
     connect(m_grid, &QListWidget::itemDoubleClicked, this, &PicturePicker::activate);
@@ -230,7 +252,72 @@ HostPath PicturePicker::firstFolder(const DrivePath& initialFolder) const {
         return *initial;
     const auto first =
         std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
-    return (first != m_places.end() ? *first : m_places.front()).folder;
+    return startOf((first != m_places.end() ? *first : m_places.front()).folder);
+}
+
+// A card opens at its newest folder.
+HostPath PicturePicker::startOf(const HostPath& place) const {
+    for (const Cards::Card& card : m_cards.all()) {
+        if (watchesCards() && card.medium.folder == place && card.summary && card.summary->pictures > 0)
+            return card.summary->newestFolder;
+    }
+    return place;
+}
+
+QLayout* PicturePicker::makeCardRow() {
+    QHBoxLayout* row = inRow(Space::Normal);
+    for (std::size_t i = 0; i < m_cardSlots.size(); ++i) {
+        auto* tile = new CardOffer(m_theme, this, CardOffer::Size::Large);
+        tile->setObjectName(u"card(%1)"_s.arg(i));
+        keepPlaceWhenHidden(*tile);
+        connect(tile, &QAbstractButton::clicked, this, [this, i] { openCard(i); });
+        m_cardSlots[i].tile = tile;
+        row->addWidget(tile, 1);
+    }
+    m_watch.emplace(m_cards);
+    connect(&m_cards, &Cards::changed, this, &PicturePicker::showCards);
+    showCards();
+    return row;
+}
+
+void PicturePicker::showCards() {
+    const std::vector<Cards::Card> cards = m_cards.all();
+    const auto find = [&](const QString& medium) {
+        return std::find_if(cards.begin(), cards.end(),
+                            [&](const Cards::Card& card) { return card.medium.id == medium; });
+    };
+    for (CardSlot& slot : m_cardSlots) {
+        if (find(slot.medium) == cards.end())
+            slot = {slot.tile, {}, {}};
+    }
+    for (const Cards::Card& card : cards) {
+        const auto has = [](const QString& medium) {
+            return [medium](const CardSlot& slot) { return slot.medium == medium; };
+        };
+        if (std::any_of(m_cardSlots.begin(), m_cardSlots.end(), has(card.medium.id)))
+            continue;
+        const auto empty = std::find_if(m_cardSlots.begin(), m_cardSlots.end(), has({}));
+        if (empty != m_cardSlots.end())
+            empty->medium = card.medium.id;
+    }
+    for (CardSlot& slot : m_cardSlots) {
+        const auto card = find(slot.medium);
+        const bool in = card != cards.end();
+        const CardWords words =
+            in ? cardWords(*card, m_clock.now().date(), m_state.english()) : noCardWords(m_state.english());
+        slot.picture = words.opens ? card->summary->newestPicture : HostPath();
+        slot.tile->setVisible(in || &slot == &m_cardSlots.front());
+        slot.tile->setEnabled(words.opens);
+        slot.tile->setText(words.head);
+        slot.tile->setNote(words.note);
+        slot.tile->setToolTip(in ? card->medium.label : QString());
+        slot.tile->setAccessibleName(words.note.isEmpty() ? words.head : words.head + u", "_s + words.note);
+    }
+}
+
+void PicturePicker::openCard(std::size_t slot) {
+    if (!m_cardSlots[slot].picture.empty())
+        Q_EMIT finished(pathText(m_cardSlots[slot].picture));
 }
 
 std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initialFolder) const {
@@ -302,19 +389,14 @@ void PicturePicker::open(const HostPath& folder) {
     };
     std::sort(folders.begin(), folders.end(), byName);
     std::sort(files.begin(), files.end(), byName);
-    const auto add = [&](const HostPath& path, bool isFolder) {
-        auto* item = new QListWidgetItem(nameOf(path), m_grid);
-        item->setData(PathRole, QByteArray::fromStdString(path.string()));
-        item->setData(FolderRole, isFolder);
-        item->setToolTip(nameOf(path));
-        item->setData(PlainRole, !isFolder && !isPicture(path));
-        if (!isFolder && isJpeg(path))
-            m_unread.push_back(m_grid->row(item));
-    };
     for (const HostPath& path : folders)
-        add(path, true);
-    for (const HostPath& path : files)
-        add(path, false);
+        addPicture(path, true);
+    if (watchesCards()) {
+        addByDays(files);
+    } else {
+        for (const HostPath& path : files)
+            addPicture(path, false);
+    }
     m_empty->setVisible(m_grid->count() == 0);
     m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
                                              u"This folder can't be opened. Choose another place."_s)
@@ -323,13 +405,45 @@ void PicturePicker::open(const HostPath& folder) {
                                    : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
                                                      u"There are no pictures here. Choose another place."_s));
     if (m_grid->count() > 0)
-        m_grid->setCurrentRow(0, QItemSelectionModel::NoUpdate);
+        m_grid->setCurrentRow(m_grid->item(0)->data(HeadingRole).toBool() ? 1 : 0, QItemSelectionModel::NoUpdate);
     if (!m_unread.empty())
         m_reader.start();
 }
 
 bool PicturePicker::isPicture(const HostPath& path) const {
     return isPictureFile(nameOf(path), m_state.door.everyFormat);
+}
+
+void PicturePicker::addPicture(const HostPath& path, bool isFolder) {
+    auto* item = new QListWidgetItem(nameOf(path), m_grid);
+    item->setData(PathRole, QByteArray::fromStdString(path.string()));
+    item->setData(FolderRole, isFolder);
+    item->setToolTip(nameOf(path));
+    item->setData(PlainRole, !isFolder && !isPicture(path));
+    if (!isFolder && isJpeg(path))
+        m_unread.push_back(m_grid->row(item));
+}
+
+void PicturePicker::addHeading(const QString& words) {
+    auto* item = new QListWidgetItem(words, m_grid);
+    item->setData(HeadingRole, true);
+    item->setFlags(Qt::NoItemFlags);
+}
+
+// By the times of the files, the newest day and picture first; the files come sorted by name.
+void PicturePicker::addByDays(const std::vector<HostPath>& files) {
+    std::vector<std::pair<QDateTime, HostPath>> timed;
+    for (const HostPath& file : files)
+        timed.emplace_back(QFileInfo(toText(file)).lastModified(), file);
+    std::stable_sort(timed.begin(), timed.end(), [](const auto& a, const auto& b) { return a.first > b.first; });
+    std::optional<QDate> day;
+    for (const auto& [time, file] : timed) {
+        if (day != time.date()) {
+            day = time.date();
+            addHeading(dayWords(*day, m_clock.now().date(), m_state.english()));
+        }
+        addPicture(file, false);
+    }
 }
 
 void PicturePicker::readNext() {

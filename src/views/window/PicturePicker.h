@@ -2,17 +2,22 @@
 
 #include "platform/Dialogs.h"
 #include "platform/files/HostPath.h"
+#include "platform/media/Cards.h"
 #include "views/kit/Overlay.h"
 
 #include <QImage>
 #include <QListWidget>
 #include <QTimer>
 
+#include <array>
 #include <deque>
+#include <optional>
 #include <vector>
 
 namespace lumora {
 
+class CardOffer;
+class Clock;
 class ElidedLabel;
 class Files;
 struct SessionState;
@@ -20,13 +25,15 @@ struct SessionState;
 // The picker of one picture: the places at the side, memory cards first, and a grid of the folders and JPEG files of
 // the place that is open. A click chooses, a double click or Enter takes it. Small pictures are read one after another
 // once the grid stands, those in view first, so that a folder of thousands opens at once. Where every file is on offer,
-// other files show by a sign.
+// other files show by a sign. Where the lab has cards watched, those that are in stand above, and pictures stand by
+// days.
 class PicturePicker : public Overlay {
     Q_OBJECT
 public:
     // The picker opens at initialFolder when no better place is known.
-    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                  const QString& prompt, const DrivePath& initialFolder, const QString& title, Dialogs::Offer offer);
+    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files, Cards& cards,
+                  const Clock& clock, const QString& prompt, const DrivePath& initialFolder, const QString& title,
+                  Dialogs::Offer offer);
 
 Q_SIGNALS:
     // The drive path of the picture as the code page has it ("?" for what it lacks); empty for a cancel.
@@ -41,6 +48,14 @@ private:
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
     std::vector<Place> places(const DrivePath& initialFolder) const;
     HostPath firstFolder(const DrivePath& initialFolder) const;
+    bool watchesCards() const { return !everyFile() && m_cards.areWatched(); }
+    HostPath startOf(const HostPath& place) const;
+    QLayout* makeCardRow();
+    void showCards();
+    void openCard(std::size_t slot);
+    void addHeading(const QString& words);
+    void addPicture(const HostPath& path, bool isFolder);
+    void addByDays(const std::vector<HostPath>& files);
     QLayout* makePlaces();
     void makeGrid();
     QPushButton* wordButton(const QString& name, const char* role, const QString& text,
@@ -55,7 +70,17 @@ private:
     const Theme& m_theme;
     const SessionState& m_state;
     const Files& m_files;
+    Cards& m_cards;
+    const Clock& m_clock;
     const Dialogs::Offer m_offer;
+    // A card keeps its place while it is in, so that no tile moves below a finger.
+    struct CardSlot {
+        CardOffer* tile = nullptr;
+        QString medium;
+        HostPath picture; // the newest, empty when none can be opened
+    };
+    std::array<CardSlot, 2> m_cardSlots;
+    std::optional<Cards::Watch> m_watch;
     std::vector<Place> m_places;
     std::vector<QPushButton*> m_placeButtons;
     HostPath m_folder;

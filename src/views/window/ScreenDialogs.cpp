@@ -11,10 +11,13 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files)
+ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files, Cards& cards,
+                             const Clock& clock)
     : m_window(window)
     , m_state(state)
-    , m_files(files) {}
+    , m_files(files)
+    , m_cards(cards)
+    , m_clock(clock) {}
 
 ScreenDialogs::~ScreenDialogs() = default;
 
@@ -90,7 +93,8 @@ DrivePath ScreenDialogs::pickFile(const QString& prompt, const DrivePath& initia
         if (const std::optional<DrivePath> pick = nextPick())
             return *pick;
     }
-    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, prompt, initialFolder, title, offer);
+    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, m_cards, m_clock, prompt, initialFolder, title,
+                         offer);
     picker.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     QEventLoop loop;
     QString chosen;

@@ -11,6 +11,8 @@
 
 namespace lumora {
 
+class Cards;
+class Clock;
 class Files;
 class MainWindow;
 class MessagePanel;
@@ -21,7 +23,7 @@ struct SessionState;
 class ScreenDialogs : public QObject, public Dialogs {
     Q_OBJECT
 public:
-    ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files);
+    ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files, Cards& cards, const Clock& clock);
     ~ScreenDialogs() override;
 
     void message(const QString& text, const QString& title = {}) override;
@@ -55,6 +57,8 @@ private:
     MainWindow& m_window;
     const SessionState& m_state;
     const Files& m_files;
+    Cards& m_cards;
+    const Clock& m_clock;
     QList<Box> m_waiting;
     QPointer<MessagePanel> m_panel;
 };

@@ -1,0 +1,77 @@
+#include "selection/CardWords.h"
+
+#include <QLocale>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QString headOf(const Medium& medium, bool english) {
+    switch (medium.kind) {
+    case Medium::Kind::SdCard:
+        return english ? u"SD card"_s : u"כרטיס SD"_s;
+    case Medium::Kind::Card:
+        return english ? u"Memory card"_s : u"כרטיס זיכרון"_s;
+    case Medium::Kind::Stick:
+        return english ? u"USB stick"_s : u"התקן USB"_s;
+    case Medium::Kind::Other:
+        break;
+    }
+    return !medium.label.isEmpty() ? medium.label : english ? u"Card or stick"_s : u"כרטיס או התקן USB"_s;
+}
+
+QString countOf(const CardSummary& card, bool english) {
+    if (card.pictures == 1 && !card.more)
+        return english ? u"1 picture"_s : u"תמונה אחת"_s;
+    const QString count = english ? u"%1 pictures"_s : u"%1 תמונות"_s;
+    const QString more = english ? u"more than %1 pictures"_s : u"יותר מ-%1 תמונות"_s;
+    return (card.more ? more : count).arg(card.pictures);
+}
+
+QString newestOf(QDate day, QDate today, bool english) {
+    const qint64 ago = day.daysTo(today);
+    if (ago == 0)
+        return english ? u"newest today"_s : u"החדשה מהיום"_s;
+    if (ago == 1)
+        return english ? u"newest yesterday"_s : u"החדשה מאתמול"_s;
+    return (english ? u"newest %1"_s : u"החדשה מ-%1"_s).arg(day.toString(u"d.M.yyyy"_s));
+}
+
+} // namespace
+
+CardWords cardWords(const Cards::Card& card, QDate today, bool english) {
+    CardWords words{headOf(card.medium, english), {}, false};
+    if (!card.summary)
+        words.note = english ? u"counting the pictures…"_s : u"סופר את התמונות…"_s;
+    else if (!card.summary->readable)
+        words.note = english ? u"can't be read"_s : u"לא ניתן לקריאה"_s;
+    else if (card.summary->pictures == 0)
+        words.note = english ? u"no pictures"_s : u"אין תמונות"_s;
+    else
+        words = {words.head,
+                 countOf(*card.summary, english) + u" · "_s + newestOf(card.summary->newest, today, english), true};
+    return words;
+}
+
+CardWords noCardWords(bool english) {
+    return {english ? u"Put in a memory card or a stick, and it shows here"_s
+                    : u"כרטיס זיכרון או התקן USB שיוכנס יופיע כאן"_s,
+            {},
+            false};
+}
+
+QString dayWords(QDate day, QDate today, bool english) {
+    const QLocale language(english ? QLocale::English : QLocale::Hebrew);
+    const QString date =
+        english ? language.toString(day, u"dddd, d MMMM yyyy"_s) : language.toString(day, u"dddd, d בMMMM yyyy"_s);
+    const qint64 ago = day.daysTo(today);
+    if (ago == 0)
+        return (english ? u"Today"_s : u"היום"_s) + u" · "_s + date;
+    if (ago == 1)
+        return (english ? u"Yesterday"_s : u"אתמול"_s) + u" · "_s + date;
+    return date;
+}
+
+} // namespace lumora

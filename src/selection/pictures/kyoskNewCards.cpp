@@ -1,0 +1,59 @@
+// The page of pictures: the card or stick that was put in is offered.
+#include "common/AnsiCodePage.h"
+#include "platform/Machine.h"
+#include "platform/Platform.h"
+#include "selection/CardWords.h"
+#include "selection/pictures/kyoskNew.h"
+#include "session/SessionState.h"
+
+#include <algorithm>
+
+namespace lumora {
+
+void kyoskNew::watchCards() {
+    if (!m_platform.cards.areWatched())
+        return;
+    m_watch.emplace(m_platform.cards);
+    connect(&m_platform.cards, &Cards::changed, this, [this] {
+        if (m_handedOver)
+            return;
+        showCards();
+        Q_EMIT changed();
+    });
+}
+
+// The card that came last is offered, until its newest pictures are among those of the page.
+void kyoskNew::showCards() {
+    if (!m_platform.cards.areWatched())
+        return;
+    CardWords words = noCardWords(m_state.english());
+    m_cardPicture = {};
+    for (const Cards::Card& card : m_platform.cards.all()) {
+        DrivePath picture;
+        if (card.summary && card.summary->pictures > 0)
+            picture =
+                DrivePath(AnsiCodePage::squeeze(m_platform.files.drives().toDrive(card.summary->newestPicture).text()));
+        if (!picture.isEmpty() && m_choice.folders().paths().contains(picture.text()))
+            continue;
+        words = cardWords(card, m_platform.clock.now().date(), m_state.english());
+        m_cardPicture = picture;
+    }
+    cardOffer.visible = true;
+    cardOffer.enabled = words.opens;
+    cardOffer.text = words.head;
+    cardNote.text = words.note;
+}
+
+void kyoskNew::openCard() {
+    if (m_picking || m_handedOver || m_cardPicture.isEmpty())
+        return;
+    m_picking = true;
+    turnPage([this] {
+        const DrivePath picture = m_cardPicture;
+        if (!refusesName(picture))
+            showFolderOf(picture);
+    });
+    m_picking = false;
+}
+
+} // namespace lumora
