@@ -47,7 +47,9 @@ void Cards::unwatch() {
     m_thread->quit();
     m_thread->wait();
     m_thread.reset();
-    take({});
+    // Nobody is told: the last watcher may be half destroyed.
+    while (!m_cards.empty())
+        forget(m_cards.size() - 1);
 }
 
 std::vector<Cards::Card> Cards::all() const {
