@@ -62,14 +62,14 @@ struct Program::Parts {
         , fileSystem(drives)
         , volume(fileSystem, dataFolder, NetworkCards(),
                  [](const Failure& why) { warn(u"the mark of the data folder can't be kept: %1"_s.arg(why.message)); })
-        , cards(deployment.watchedCards ? std::move(media) : Cards::Source())
+        , cards(deployment.watchedCards ? std::move(media) : Cards::Source(), deployment.door.everyFormat)
         , internet({}, deployment.ftpType)
         , shell(drives)
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, files, cards, clock)
-        , platform{files,     dialogs,      line ? *line : internet, mail, shell, clock, pump, volume,
-                   instances, cards, doorProgram()} {
+        , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
+                   cards, doorProgram()} {
         // A medium has its letter before any page hears of it.
         QObject::connect(&cards, &Cards::changed, &window, [this] { drives.refreshMedia(); });
         dialogs.beforePick = [this] { drives.refreshMedia(); };

@@ -74,14 +74,13 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
     TestPlatform machine;
     SessionState state;
     state.EnglishTips = 1;
+    state.door.everyFormat = true;
     const HostPath media = toHostPath(machine.folder.path()) / "media";
     const QDateTime now = machine.clock.now();
-    for (const auto& [name, hoursAgo] : {std::pair("100CANON/a.jpg", 70),
-                                         {"101CANON/old.jpg", 60},
-                                         {"101CANON/b.jpg", 15},
-                                         {"101CANON/c.JPG", 1},
-                                         {"101CANON/a.jpg", 15},
-                                         {"101CANON/notes.txt", 1}}) {
+    const std::pair<const char*, int> files[] = {{"100CANON/a.jpg", 70}, {"101CANON/old.jpg", 60},
+                                                 {"101CANON/b.jpg", 15}, {"101CANON/c.HEIC", 1},
+                                                 {"101CANON/a.jpg", 15}, {"101CANON/notes.txt", 1}};
+    for (const auto& [name, hoursAgo] : files) {
         const HostPath path = media / "EOS" / "DCIM" / name;
         std::filesystem::create_directories(path.parent_path());
         QFile file(toText(path));
@@ -89,10 +88,11 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
                     file.setFileTime(now.addSecs(-3600 * hoursAgo), QFileDevice::FileModificationTime));
     }
     machine.drives.refreshMedia();
-    Cards cards(
-        [media] { return std::make_unique<MediaFolders>(std::vector{media}, [](const HostPath&) { return true; }); });
+    const auto isMounted = [](const HostPath&) { return true; };
+    Cards cards([&] { return std::make_unique<MediaFolders>(std::vector{media}, isMounted); }, true);
     const Cards::Watch watch(cards);
     ASSERT_TRUE(QTest::qWaitFor([&] { return !cards.all().empty() && cards.all()[0].summary; }, 20000));
+    EXPECT_EQ(cards.all()[0].summary->pictures, 5) << "of every format";
     const Theme theme(1);
     QWidget window;
     const PicturePicker picker(theme, &window, state, machine.files, cards, machine.clock, u"x"_s, {}, {},
@@ -102,7 +102,7 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
     for (int row = 0; row < grid->count(); ++row)
         rows += grid->item(row)->text();
     EXPECT_EQ(rows.join(u'|'),
-              u"Today · Saturday, 21 November 2026|c.JPG|Yesterday · Friday, 20 November 2026|a.jpg|b.jpg|"
+              u"Today · Saturday, 21 November 2026|c.HEIC|Yesterday · Friday, 20 November 2026|a.jpg|b.jpg|"
               "Thursday, 19 November 2026|old.jpg");
     EXPECT_EQ(grid->currentRow(), 1);
 }

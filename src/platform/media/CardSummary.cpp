@@ -57,8 +57,9 @@ std::optional<CameraFolder> cameraFolder(const HostPath& folder) {
 
 class CardCount {
 public:
-    CardCount(const HostPath& root, const std::atomic_bool& stop)
-        : m_stop(stop) {
+    CardCount(const HostPath& root, const std::atomic_bool& stop, bool everyFormat)
+        : m_stop(stop)
+        , m_everyFormat(everyFormat) {
         std::error_code error;
         std::vector<HostPath> cameras;
         fs::directory_iterator at(root, error);
@@ -116,7 +117,7 @@ private:
                 continue;
             if (type == fs::file_type::directory && deeper > 0)
                 walk(at->path(), deeper - 1);
-            else if (type == fs::file_type::regular && isPictureFile(name))
+            else if (type == fs::file_type::regular && isPictureFile(name, m_everyFormat))
                 take(folder, at->path());
         }
     }
@@ -131,6 +132,7 @@ private:
     }
 
     const std::atomic_bool& m_stop;
+    const bool m_everyFormat;
     CardSummary m_summary;
     std::map<HostPath, Newest> m_folders;
     int m_entries = 0;
@@ -138,8 +140,8 @@ private:
 
 } // namespace
 
-CardSummary summaryOfCard(const HostPath& root, const std::atomic_bool& stop) {
-    return CardCount(root, stop).summary();
+CardSummary summaryOfCard(const HostPath& root, const std::atomic_bool& stop, bool everyFormat) {
+    return CardCount(root, stop, everyFormat).summary();
 }
 
 } // namespace lumora

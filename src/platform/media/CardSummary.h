@@ -20,7 +20,7 @@ struct CardSummary {
 };
 
 // Follows no links, leaves out what is hidden, and ends early after many files, many levels, or when stop is set.
-// Pictures count by their names (isPictureFile) and by the time of their files.
-CardSummary summaryOfCard(const HostPath& root, const std::atomic_bool& stop);
+// Pictures count by their names (isPictureFile, with everyFormat) and by the time of their files.
+CardSummary summaryOfCard(const HostPath& root, const std::atomic_bool& stop, bool everyFormat = false);
 
 } // namespace lumora

@@ -10,8 +10,9 @@ struct Cards::Entry {
     std::shared_ptr<std::atomic_bool> stop = std::make_shared<std::atomic_bool>(false);
 };
 
-Cards::Cards(Source source)
-    : m_source(std::move(source)) {}
+Cards::Cards(Source source, bool everyFormat)
+    : m_source(std::move(source))
+    , m_everyFormat(everyFormat) {}
 
 Cards::~Cards() {
     for (const auto& entry : m_cards)
@@ -89,8 +90,9 @@ void Cards::forget(std::size_t entry) {
 void Cards::count(Entry& entry) {
     const auto summary = std::make_shared<CardSummary>();
     const auto stop = entry.stop;
-    QThread* counting =
-        QThread::create([summary, stop, root = entry.card.medium.folder] { *summary = summaryOfCard(root, *stop); });
+    QThread* counting = QThread::create([summary, stop, root = entry.card.medium.folder, every = m_everyFormat] {
+        *summary = summaryOfCard(root, *stop, every);
+    });
     m_counts.push_back(counting);
     connect(counting, &QThread::finished, this, [this, counting, summary, stop] {
         std::erase(m_counts, counting);

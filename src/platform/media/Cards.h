@@ -18,8 +18,8 @@ class Cards : public QObject {
     Q_OBJECT
 public:
     using Source = std::function<std::unique_ptr<RemovableMedia>()>;
-    // Without a source nothing is ever in.
-    explicit Cards(Source source = {});
+    // Without a source nothing is ever in. everyFormat: what counts as a picture, see isPictureFile.
+    explicit Cards(Source source = {}, bool everyFormat = false);
     ~Cards() override;
 
     // The lab wants cards to be shown.
@@ -59,6 +59,7 @@ private:
     void forget(std::size_t entry);
 
     Source m_source;
+    bool m_everyFormat;
     int m_watchers = 0;
     std::unique_ptr<QThread> m_thread; // the source lives in it
     std::vector<std::unique_ptr<Entry>> m_cards;

@@ -95,8 +95,7 @@ void kyoskNew::pickFolder() {
 
 // A picture whose own name is outside the code page fails alone, when the order is prepared.
 bool kyoskNew::refusesName(const DrivePath& picture) {
-    if (!plain() || m_door->isOpen() ||
-        !HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text()))
+    if (!plain() || m_door->isOpen() || !HasQuestionMark(m_state.Careful ? picture.folder().text() : picture.text()))
         return false;
     m_platform.dialogs.message(u"File Coold not Be Rcognized\nPleas Rename Folder Name \nTo English"_s);
     return true;

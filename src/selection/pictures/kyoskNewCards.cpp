@@ -30,9 +30,12 @@ void kyoskNew::showCards() {
     m_cardPicture = {};
     for (const Cards::Card& card : m_platform.cards.all()) {
         DrivePath picture;
-        if (card.summary && card.summary->pictures > 0)
-            picture =
-                DrivePath(AnsiCodePage::squeeze(m_platform.files.drives().toDrive(card.summary->newestPicture).text()));
+        if (card.summary && card.summary->pictures > 0) {
+            // As the picker tells it.
+            picture = m_platform.files.drives().toDrive(card.summary->newestPicture);
+            if (!m_state.door.any())
+                picture = DrivePath(AnsiCodePage::squeeze(picture.text()));
+        }
         if (!picture.isEmpty() && m_choice.folders().paths().contains(picture.text()))
             continue;
         words = cardWords(card, m_platform.clock.now().date(), m_state.english());
