@@ -40,18 +40,18 @@ Failure::Kind kindOf(int error) {
     }
 }
 
-QString nameOf(const std::filesystem::path& path) {
+} // namespace
+
+QString shownPath(const std::filesystem::path& path) {
     return QString::fromLocal8Bit(path.c_str());
 }
-
-} // namespace
 
 Failure systemFailure(int error, const QString& path) {
     return {kindOf(error), u"%1: %2"_s.arg(path, QString::fromLocal8Bit(std::strerror(error)))};
 }
 
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int error) {
-    return systemFailure(error, u"%1: %2"_s.arg(nameOf(path), what));
+    return systemFailure(error, u"%1: %2"_s.arg(shownPath(path), what));
 }
 
 Descriptor::Descriptor(Descriptor&& other) noexcept
@@ -202,7 +202,7 @@ Result<qint64> appendFrom(const Descriptor& source, qint64 count, NewContent& ta
 }
 
 Result<void> writeWholeFile(const std::filesystem::path& path, const QByteArray& bytes) {
-    NewContent content(path, u"%1: can't be written"_s.arg(nameOf(path)));
+    NewContent content(path, u"%1: can't be written"_s.arg(shownPath(path)));
     content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
     return content.commit();
 }

@@ -11,6 +11,9 @@
 // Files of this machine, read and written whole. A failure's message names the path, or what the caller calls it.
 namespace lumora {
 
+// A path as it is shown to a person.
+QString shownPath(const std::filesystem::path& path);
+
 // The failure of an errno: "PATH: reason", or "PATH: what: reason".
 Failure systemFailure(int error, const QString& path);
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int error);

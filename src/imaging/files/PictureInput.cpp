@@ -6,7 +6,6 @@
 #include <cerrno>
 #include <cstring>
 #include <fcntl.h>
-#include <string>
 #include <sys/stat.h>
 #include <unistd.h>
 #include <utility>
@@ -27,8 +26,7 @@ QString cannotBeRead() {
 } // namespace
 
 Failure pictureFailure(const std::filesystem::path& path, Failure::Kind kind, const QString& reason) {
-    const std::string name = path.string();
-    return {kind, QString::fromUtf8(name.data(), static_cast<qsizetype>(name.size())) + u": "_s + reason};
+    return {kind, u"%1: %2"_s.arg(shownPath(path), reason)};
 }
 
 Result<void> checkPictureBounds(const std::filesystem::path& path, std::int64_t width, std::int64_t height) {
