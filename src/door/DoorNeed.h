@@ -7,7 +7,7 @@
 
 namespace lumora {
 
-// What a file needs to be an upright sRGB JPEG of the ending .jpg.
+// What a file needs to be an upright sRGB JPEG of the ending .jpg; inks without a profile may stay.
 enum class DoorNeed {
     Nothing,
     Copy, // only its ending is another
@@ -16,7 +16,7 @@ enum class DoorNeed {
     Unreadable,
 };
 
-// The colours of a picture by its header, the strongest word first: profile, coded and named colours, EXIF.
+// The colours of a picture by its header, the strongest word first: PNG's codes, profile, named colours, EXIF.
 struct HeaderColours {
     enum class Source { None, Profile, Named, HighRange } source = Source::None;
     PictureColours named;

@@ -11,7 +11,8 @@ namespace lumora {
 namespace {
 
 constexpr qint64 headSize = 65536;
-constexpr int maxParts = 2000; // segments or chunks that are looked at
+constexpr int maxParts = 2000;        // segments or chunks that are looked at
+constexpr int maxDataParts = 100'000; // chunks of pixels that are passed over; large pictures have some ten thousand
 constexpr qint64 maxProfile = 4 << 20;
 constexpr qint64 maxExif = 1 << 20;
 constexpr QByteArrayView exifMark("Exif\0\0", 6);
@@ -43,7 +44,7 @@ private:
 class Exif {
 public:
     explicit Exif(const QByteArray& tiff)
-        : m_fields(tiff, tiff.startsWith("II")) {}
+        : m_fields(isTiff(tiff) ? tiff : QByteArray(), tiff.startsWith("II")) {}
 
     int orientation() const {
         const int value = m_fields.word(valueOf(first(), 0x0112));
@@ -65,9 +66,13 @@ public:
     }
 
 private:
+    static constexpr qint64 outside = -16; // no number that is read there reaches into the bytes
+
+    static bool isTiff(QByteArrayView bytes) {
+        return bytes.startsWith(QByteArrayView("II*\0", 4)) || bytes.startsWith(QByteArrayView("MM\0*", 4));
+    }
     qint64 first() const { return m_fields.number(4); }
 
-    // The place of an entry's value, or one outside.
     qint64 valueOf(qint64 directory, int tag) const {
         const int count = directory >= 8 ? m_fields.word(directory) : 0;
         for (int i = 0; i < count; ++i) {
@@ -75,7 +80,7 @@ private:
             if (m_fields.word(entry) == tag)
                 return entry + 8;
         }
-        return -1;
+        return outside;
     }
 
     Fields m_fields;
@@ -176,13 +181,14 @@ void readPng(const PictureBytes& bytes, PictureHeader& header) {
     QByteArray lights;
     bool isSrgb = false;
     qint64 at = 8;
-    for (int i = 0; i < maxParts; ++i) {
+    for (int parts = 0, dataParts = 0; parts < maxParts && dataParts < maxDataParts;) {
         const QByteArray head = bytes.part(at, 8);
         if (head.isEmpty())
             break;
         const Fields fields(head);
         const qint64 length = fields.number(0);
         const QByteArrayView name = fields.text(4, 4);
+        ++(name == "IDAT" ? dataParts : parts);
         const auto content = [&](qint64 wanted) { return bytes.part(at + 8, wanted); };
         if (name == "IHDR") {
             const Fields sides(content(8));

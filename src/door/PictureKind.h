@@ -6,7 +6,7 @@ namespace lumora {
 
 enum class PictureKind { None, Jpeg, Png, Heif, Avif, WebP, Tiff, Bmp, Gif };
 
-// What a file is by its first bytes; 64 of them are enough, fewer are allowed.
+// What a file is by its first bytes: 18 of them, and of an ISO media file its whole list of brands. Fewer are allowed.
 PictureKind pictureKindOf(QByteArrayView head);
 
 } // namespace lumora
