@@ -1,6 +1,6 @@
 #include "door/DoorChild.h"
 
-#include "common/HostFile.h"
+#include "door/Confinement.h"
 #include "door/UprightJpeg.h"
 
 #include <cerrno>
@@ -13,17 +13,6 @@
 namespace lumora {
 
 namespace {
-
-DoorStatus statusOf(Failure::Kind kind) {
-    switch (kind) {
-    case Failure::Kind::TooLarge:
-        return DoorStatus::TooLarge;
-    case Failure::Kind::Unsupported:
-        return DoorStatus::Unsupported;
-    default:
-        return DoorStatus::Damaged;
-    }
-}
 
 bool writeAll(const QByteArray& bytes) {
     for (qsizetype done = 0; done < bytes.size();) {
@@ -39,15 +28,12 @@ bool writeAll(const QByteArray& bytes) {
 DoorStatus decode() try {
     auto reader = StoredPictureReader::open("/proc/self/fd/" + std::to_string(doorSourceNumber));
     if (!reader)
-        return statusOf(reader.failure().kind);
+        return doorStatusOf(reader.failure());
     if (!confineMyself())
         return DoorStatus::NotConfined;
-    const auto made = makeUprightJpeg(**reader);
-    if (!made)
-        return statusOf(made.failure().kind);
-    if (!writeAll(made->bytes))
-        return DoorStatus::TooLarge;
-    return made->profileIgnored ? DoorStatus::ProfileIgnored : DoorStatus::Done;
+    QByteArray jpeg;
+    const DoorStatus made = makeUprightJpeg(**reader, jpeg);
+    return jpeg.isEmpty() || writeAll(jpeg) ? made : DoorStatus::TooLarge;
 } catch (const std::bad_alloc&) {
     return DoorStatus::TooLarge;
 }
@@ -55,14 +41,14 @@ DoorStatus decode() try {
 } // namespace
 
 bool limitDoorChild(int argc, char** argv) {
-    if (argc != 4)
+    if (argc != 5)
         return false;
     const DoorLimits limits{std::atoi(argv[2]), std::atoll(argv[3])};
-    return limits.seconds > 0 && limits.memory > 0 && limitMyself(limits);
+    return limits.seconds > 0 && limits.memory > 0 && limitMyself(limits, std::atoi(argv[4]));
 }
 
 // Ends without the destructors of what is left, which the confined process may not all run.
-int runDoorChild(int argc, char** argv) {
+void runDoorChild(int argc, char** argv) {
     _exit(static_cast<int>(limitDoorChild(argc, argv) ? decode() : DoorStatus::NotConfined));
 }
 

@@ -2,9 +2,14 @@
 
 #include "common/HostFile.h"
 #include "door/DoorChild.h"
+#include "door/DoorStatus.h"
+#include "imaging/files/PictureInput.h"
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
+#include <chrono>
+#include <climits>
 #include <string>
 #include <utility>
 
@@ -23,57 +28,90 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-QString nameOf(const std::filesystem::path& path) {
-    return QString::fromLocal8Bit(path.c_str());
+Failure damaged(const std::filesystem::path& source) {
+    return pictureFailure(source, Failure::Kind::Damaged, u"this file is damaged"_s);
 }
 
-Failure failureOf(const std::filesystem::path& source, Failure::Kind kind, const QString& reason) {
-    return {kind, u"%1: %2"_s.arg(nameOf(source), reason)};
+Failure takesTooLong(const std::filesystem::path& source) {
+    return pictureFailure(source, Failure::Kind::TimedOut, u"this file takes too long to decode"_s);
 }
 
-PictureHeader headerOf(const Descriptor& file) {
-    return readPictureHeader(PictureBytes([&file](qint64 at, qint64 count) {
-        QByteArray bytes(count, Qt::Uninitialized);
-        qint64 filled = 0;
-        while (filled < count) {
-            const ssize_t got =
-                ::pread(file.number(), bytes.data() + filled, static_cast<std::size_t>(count - filled), at + filled);
-            if (got < 0 && errno == EINTR)
-                continue;
-            if (got <= 0)
-                break;
-            filled += got;
-        }
-        bytes.truncate(filled);
-        return bytes;
-    }));
+Failure tooLarge(const std::filesystem::path& source) {
+    return pictureFailure(source, Failure::Kind::TooLarge, u"the picture is too large"_s);
+}
+
+Failure notRead(const std::filesystem::path& source, int error) {
+    return fileFailure(source, u"can't be read"_s, error);
+}
+
+// The bytes from a place on, fewer at the end of the file or at an error, which is kept.
+QByteArray readPart(const Descriptor& file, qint64 at, qint64 count, int& error) {
+    QByteArray bytes(count, Qt::Uninitialized);
+    qint64 filled = 0;
+    while (filled < count) {
+        const ssize_t got =
+            ::pread(file.number(), bytes.data() + filled, static_cast<std::size_t>(count - filled), at + filled);
+        if (got < 0 && errno == EINTR)
+            continue;
+        if (got < 0)
+            error = errno;
+        if (got <= 0)
+            break;
+        filled += got;
+    }
+    bytes.truncate(filled);
+    return bytes;
+}
+
+Result<PictureHeader> headerOf(const Descriptor& file, const std::filesystem::path& source) {
+    int error = 0;
+    PictureHeader header =
+        readPictureHeader(PictureBytes([&](qint64 at, qint64 count) { return readPart(file, at, count, error); }));
+    if (error != 0)
+        return notRead(source, error);
+    return header;
 }
 
 Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source,
                         DoorRules rules = {true, true, true}) {
-    const DoorNeed need = doorNeedOf(header, nameOf(source), rules);
+    const DoorNeed need = doorNeedOf(header, shownPath(source), rules);
     if (need != DoorNeed::Unreadable)
         return need;
     if (header.kind != PictureKind::None)
-        return failureOf(source, Failure::Kind::Damaged, u"this file is damaged"_s);
+        return damaged(source);
     if (::lseek(file.number(), 0, SEEK_END) == 0)
-        return failureOf(source, Failure::Kind::Damaged, u"the file is empty"_s);
-    return failureOf(source, Failure::Kind::Unsupported, u"is no picture of a known kind"_s);
+        return pictureFailure(source, Failure::Kind::Damaged, u"the file is empty"_s);
+    return pictureFailure(source, Failure::Kind::Unsupported, u"is no picture of a known kind"_s);
 }
 
 class FileActions {
 public:
-    FileActions() { posix_spawn_file_actions_init(&m_actions); }
+    FileActions()
+        : m_error(posix_spawn_file_actions_init(&m_actions))
+        , m_made(m_error == 0) {}
     FileActions(const FileActions&) = delete;
     FileActions& operator=(const FileActions&) = delete;
-    ~FileActions() { posix_spawn_file_actions_destroy(&m_actions); }
+    ~FileActions() {
+        if (m_made)
+            posix_spawn_file_actions_destroy(&m_actions);
+    }
 
     const posix_spawn_file_actions_t* get() const { return &m_actions; }
-    void give(int from, int to) { posix_spawn_file_actions_adddup2(&m_actions, from, to); }
-    void closeFrom(int number) { posix_spawn_file_actions_addclosefrom_np(&m_actions, number); }
+    // The first fault, an errno, or 0.
+    int error() const { return m_error; }
+    void give(int from, int to) {
+        if (m_error == 0)
+            m_error = posix_spawn_file_actions_adddup2(&m_actions, from, to);
+    }
+    void closeFrom(int number) {
+        if (m_error == 0)
+            m_error = posix_spawn_file_actions_addclosefrom_np(&m_actions, number);
+    }
 
 private:
     posix_spawn_file_actions_t m_actions;
+    int m_error;
+    const bool m_made;
 };
 
 // A copy of the descriptor above the numbers that the child's files get.
@@ -90,7 +128,8 @@ public:
     ~Child() {
         if (m_id > 0) {
             ::kill(m_id, SIGKILL);
-            (void)reap();
+            int status = 0;
+            (void)reap(status);
         }
     }
 
@@ -100,8 +139,12 @@ public:
         std::string option(doorChildOption);
         std::string seconds = std::to_string(limits.seconds);
         std::string memory = std::to_string(limits.memory);
-        const std::array<char*, 5> arguments{path.data(), option.data(), seconds.data(), memory.data(), nullptr};
+        std::string parent = std::to_string(::getpid());
+        const std::array<char*, 6> arguments{path.data(),   option.data(), seconds.data(),
+                                             memory.data(), parent.data(), nullptr};
         const Descriptor nothing(::open("/dev/null", O_RDWR | O_CLOEXEC));
+        if (!nothing.valid())
+            return errno;
         const Descriptor quiet = above(nothing.number());
         const Descriptor from = above(source);
         const Descriptor to = above(target);
@@ -113,6 +156,8 @@ public:
         actions.give(from.number(), doorSourceNumber);
         actions.give(to.number(), doorTargetNumber);
         actions.closeFrom(doorTargetNumber + 1);
+        if (actions.error() != 0)
+            return actions.error();
         pid_t id = -1;
         const int error = posix_spawn(&id, path.c_str(), actions.get(), nullptr, arguments.data(), environ);
         if (error == 0)
@@ -120,78 +165,114 @@ public:
         return error;
     }
 
-    // The status that waitpid tells, or none when the time is over.
-    std::optional<int> ended(int seconds) {
+    // Waits for the end. Gives an errno, ETIMEDOUT when the time is over, or 0 and the status that waitpid tells.
+    int ended(int seconds, int& status) {
+        using namespace std::chrono;
         const Descriptor process(static_cast<int>(::syscall(SYS_pidfd_open, m_id, 0)));
-        pollfd waited{process.number(), POLLIN, 0};
-        int ready = 0;
-        do {
-            ready = ::poll(&waited, 1, seconds * 1000);
-        } while (ready < 0 && errno == EINTR);
-        if (!process.valid() || ready <= 0)
-            return {};
-        return reap();
+        if (!process.valid())
+            return errno;
+        const auto end = steady_clock::now() + std::chrono::seconds(seconds);
+        for (;;) {
+            const auto left = ceil<milliseconds>(end - steady_clock::now()).count();
+            if (left <= 0)
+                return ETIMEDOUT;
+            pollfd waited{process.number(), POLLIN, 0};
+            const int ready = ::poll(&waited, 1, static_cast<int>(std::min<qint64>(left, INT_MAX)));
+            if (ready > 0)
+                return reap(status);
+            if (ready < 0 && errno != EINTR)
+                return errno;
+        }
     }
 
 private:
-    int reap() {
-        int status = 0;
-        while (::waitpid(m_id, &status, 0) < 0 && errno == EINTR) {
+    int reap(int& status) {
+        const pid_t id = std::exchange(m_id, -1);
+        while (::waitpid(id, &status, 0) < 0) {
+            if (errno != EINTR)
+                return errno;
         }
-        m_id = -1;
-        return status;
+        return 0;
     }
 
     pid_t m_id = -1;
 };
 
-Result<DoorDecoder::Made> madeOf(int status, const std::filesystem::path& source) {
-    const int code = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    if (WIFSIGNALED(status) && WTERMSIG(status) == SIGXCPU)
-        return failureOf(source, Failure::Kind::TimedOut, u"this file takes too long to decode"_s);
-    switch (code) {
-    case static_cast<int>(DoorStatus::Done):
-        return DoorDecoder::Made{false};
-    case static_cast<int>(DoorStatus::ProfileIgnored):
-        return DoorDecoder::Made{true};
-    case static_cast<int>(DoorStatus::TooLarge):
-        return failureOf(source, Failure::Kind::TooLarge, u"the picture is too large"_s);
-    case static_cast<int>(DoorStatus::Unsupported):
-        return failureOf(source, Failure::Kind::Unsupported, u"a kind of picture that can't be shown"_s);
-    case static_cast<int>(DoorStatus::NotConfined):
-        return failureOf(source, Failure::Kind::Other, u"this machine does not let a decoder be locked in"_s);
+Failure failureOfSignal(int signal, const std::filesystem::path& source) {
+    switch (signal) {
+    case SIGXCPU:
+        return takesTooLong(source);
+    case SIGKILL: // the machine is short of memory
+        return tooLarge(source);
+    case SIGSYS:
+        return pictureFailure(source, Failure::Kind::Other,
+                              u"this machine's library makes a call that is not allowed (SIGSYS)"_s);
     default:
-        return failureOf(source, Failure::Kind::Damaged, u"this file is damaged"_s);
+        return damaged(source);
     }
 }
 
-// The child is not believed: what it wrote has to be a JPEG file of the promised kind from its first bytes to its last.
-bool isUprightJpeg(const Descriptor& file, const QByteArray& bytes) {
-    const PictureHeader header = headerOf(file);
-    const qint64 pixels = qint64(header.size.width) * header.size.height;
-    return doorNeedOf(header, u".jpg"_s) == DoorNeed::Nothing && pixels > 0 && pixels <= maxDoorPixels &&
-           bytes.endsWith("\xFF\xD9");
+// True where the colour profile was ignored.
+Result<bool> madeOf(int status, const std::filesystem::path& source) {
+    using Kind = Failure::Kind;
+    if (WIFSIGNALED(status))
+        return failureOfSignal(WTERMSIG(status), source);
+    switch (static_cast<DoorStatus>(WEXITSTATUS(status))) {
+    case DoorStatus::Done:
+        return false;
+    case DoorStatus::ProfileIgnored:
+        return true;
+    case DoorStatus::TooLarge:
+        return tooLarge(source);
+    case DoorStatus::Unsupported:
+        return pictureFailure(source, Kind::Unsupported, u"a kind of picture that can't be shown"_s);
+    case DoorStatus::Hdr:
+        return pictureFailure(source, Kind::Unsupported, u"a picture of high dynamic range can't be shown"_s);
+    case DoorStatus::NotRead:
+        return notRead(source, EIO);
+    case DoorStatus::NotConfined:
+        return pictureFailure(source, Kind::Other, u"this machine does not let a decoder be locked in"_s);
+    case DoorStatus::Damaged:
+        break;
+    }
+    return damaged(source);
 }
 
-Result<DoorDecoder::Made> decoded(const std::filesystem::path& program, const DoorLimits& limits,
-                                  const Descriptor& file, const std::filesystem::path& source, QByteArray& bytes) {
-    const Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
+// The child is not believed: what it wrote has to be a JPEG file of the promised kind from its first bytes to its last.
+bool isUprightJpeg(const Descriptor& file) {
+    const auto header = headerOf(file, {});
+    int error = 0;
+    const qint64 size = ::lseek(file.number(), 0, SEEK_END);
+    return header && doorNeedOf(*header, u".jpg"_s) == DoorNeed::Nothing &&
+           checkPictureBounds({}, header->size.width, header->size.height) && size >= 2 &&
+           readPart(file, size - 2, 2, error) == "\xFF\xD9";
+}
+
+struct Decoded {
+    Descriptor file;
+    bool profileIgnored;
+};
+
+Result<Decoded> decoded(const std::filesystem::path& program, const DoorLimits& limits, const Descriptor& file,
+                        const std::filesystem::path& source) {
+    Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
     Child child;
     if (const int error = made.valid() ? child.start(program, limits, file.number(), made.number()) : errno; error != 0)
         return Failure{Failure::Kind::Other, fileFailure(program, u"can't be started"_s, error).message};
-    const auto status = child.ended(limits.seconds);
-    if (!status)
-        return failureOf(source, Failure::Kind::TimedOut, u"this file takes too long to decode"_s);
-    auto result = madeOf(*status, source);
-    if (!result)
-        return result;
-    auto read = readWholeFile("/proc/self/fd/" + std::to_string(made.number()), nameOf(source), limits.memory);
-    if (!read)
-        return read.failure();
-    bytes = std::move(*read);
-    if (!isUprightJpeg(made, bytes))
-        return failureOf(source, Failure::Kind::Damaged, u"this file is damaged"_s);
-    return result;
+    int status = 0;
+    const int error = child.ended(limits.seconds, status);
+    if (error == ETIMEDOUT)
+        return takesTooLong(source);
+    if (error != 0)
+        return fileFailure(program, u"its end can't be known"_s, error);
+    const auto profileIgnored = madeOf(status, source);
+    if (!profileIgnored)
+        return profileIgnored.failure();
+    if (!isUprightJpeg(made))
+        return damaged(source);
+    if (const auto begun = skipTo(made, 0, shownPath(source)); !begun)
+        return begun.failure();
+    return Decoded{std::move(made), *profileIgnored};
 }
 
 } // namespace
@@ -201,36 +282,32 @@ DoorDecoder::DoorDecoder(std::filesystem::path program, DoorLimits limits)
     , m_limits(limits) {}
 
 Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source, DoorRules rules) {
-    const auto file = openSource(source, nameOf(source));
-    return file ? lumora::needOf(headerOf(*file), *file, source, rules) : file.failure();
+    const auto file = openSource(source, shownPath(source));
+    const auto header = file ? headerOf(*file, source) : file.failure();
+    return header ? lumora::needOf(*header, *file, source, rules) : header.failure();
 }
 
 Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
                                             const std::filesystem::path& target) const {
-    const auto file = openSource(source, nameOf(source));
-    if (!file)
-        return file.failure();
-    const PictureHeader header = headerOf(*file);
-    const auto need = lumora::needOf(header, *file, source);
+    const auto file = openSource(source, shownPath(source));
+    const auto header = file ? headerOf(*file, source) : file.failure();
+    if (!header)
+        return header.failure();
+    const auto need = lumora::needOf(*header, *file, source);
     if (!need)
         return need.failure();
-    NewContent content(target, nameOf(target));
-    Result<Made> result = Made{};
-    if (*need == DoorNeed::Nothing || *need == DoorNeed::Copy) {
-        if (const auto copied = appendFrom(*file, toTheEnd, content, nameOf(source)); !copied)
-            return copied.failure();
-        result->profileIgnored = coloursOf(header).profileIgnored;
-    } else {
-        QByteArray bytes;
-        result = decoded(m_program, m_limits, *file, source, bytes);
-        if (!result)
-            return result;
-        content.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
-    }
+    const bool copied = *need == DoorNeed::Nothing || *need == DoorNeed::Copy;
+    auto picture =
+        copied ? Decoded{Descriptor(), coloursOf(*header).profileIgnored} : decoded(m_program, m_limits, *file, source);
+    if (!picture)
+        return picture.failure();
+    NewContent content(target, shownPath(target));
+    if (const auto done = appendFrom(copied ? *file : picture->file, toTheEnd, content, shownPath(source)); !done)
+        return done.failure();
     // What is lost by a crash is made again from the customer's file.
     if (auto written = content.commit(NewContent::Durability::Passing); !written)
         return written.failure();
-    return result;
+    return Made{picture->profileIgnored};
 }
 
 } // namespace lumora

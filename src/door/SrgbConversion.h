@@ -1,6 +1,7 @@
 #pragma once
 
 #include "door/PictureColours.h"
+#include "imaging/files/JpegReader.h"
 
 #include <QByteArray>
 #include <QImage>
@@ -14,7 +15,7 @@ namespace lumora {
 class SrgbConversion {
 public:
     // What the pixels of a picture are; of inks each pixel is four bytes in the place of an RGB32 one.
-    enum class Pixels { Light, Inks, InkLights };
+    using Pixels = JpegReader::Colours;
 
     // None where the profile can't be read or is not one of such pixels.
     static std::optional<SrgbConversion> ofProfile(const QByteArray& profile, Pixels pixels);

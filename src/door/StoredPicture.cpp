@@ -1,6 +1,7 @@
 #include "door/StoredPicture.h"
 
 #include "common/HostFile.h"
+#include "imaging/files/JpegReader.h"
 #include "imaging/files/OtherPictures.h"
 
 #include <QBuffer>
@@ -13,8 +14,6 @@
 #include <libheif/heif.h>
 
 namespace lumora {
-
-using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -52,6 +51,28 @@ void releasePrimary(const heif_image_handle* handle) {
     heif_image_handle_release(handle);
 }
 
+DoorStatus statusOf(const heif_error& error) {
+    switch (error.code) {
+    case heif_error_Ok:
+        return DoorStatus::Done;
+    case heif_error_Memory_allocation_error:
+        return DoorStatus::TooLarge;
+    case heif_error_Unsupported_filetype:
+    case heif_error_Unsupported_feature:
+    case heif_error_Plugin_loading_error:
+        return DoorStatus::Unsupported;
+    default:
+        return DoorStatus::Damaged;
+    }
+}
+
+// Done where a picture of these sides may be decoded.
+DoorStatus statusOfSize(qint64 width, qint64 height) {
+    if (const auto bounds = checkPictureBounds({}, width, height); !bounds)
+        return doorStatusOf(bounds.failure());
+    return width * height > maxDoorPixels ? DoorStatus::TooLarge : DoorStatus::Done;
+}
+
 HeaderColours heifColours(const heif_image_handle* handle) {
     heif_color_profile_nclx* coded = nullptr;
     if (heif_image_handle_get_nclx_color_profile(handle, &coded).code != heif_error_Ok || coded == nullptr)
@@ -83,10 +104,10 @@ bool hasWholeGifFrame(const QByteArray& bytes) {
 } // namespace
 
 Result<std::unique_ptr<StoredPictureReader>> StoredPictureReader::open(const std::filesystem::path& path) {
-    auto bytes = readWholeFile(path, QString::fromLocal8Bit(path.c_str()), maxFile);
+    auto bytes = readWholeFile(path, shownPath(path), maxFile);
     if (!bytes)
         return bytes.failure();
-    std::unique_ptr<StoredPictureReader> reader(new StoredPictureReader(path));
+    std::unique_ptr<StoredPictureReader> reader(new StoredPictureReader);
     reader->m_bytes = std::move(*bytes);
     reader->m_kind = pictureKindOf(reader->m_bytes);
     if (reader->m_kind == PictureKind::Jpeg || reader->m_kind == PictureKind::Bmp) {
@@ -104,7 +125,9 @@ Result<std::unique_ptr<StoredPictureReader>> StoredPictureReader::open(const std
     if (const char* name = qtNameOf(reader->m_kind)) {
         QBuffer nothing;
         nothing.open(QIODevice::ReadOnly);
-        (void)QImageReader(&nothing, name).canRead();
+        QImageReader qtReader(&nothing, name);
+        if (!qtReader.canRead() && qtReader.error() == QImageReader::UnsupportedFormatError)
+            return Failure{Failure::Kind::Unsupported, {}};
     }
     return reader;
 }
@@ -117,79 +140,77 @@ const PictureHeader& StoredPictureReader::header() {
     return *m_header;
 }
 
-Result<StoredPicture> StoredPictureReader::read() {
-    StoredPicture picture;
+DoorStatus StoredPictureReader::read(StoredPicture& picture) {
     picture.colours = coloursOf(header());
     picture.profile = header().profile;
     picture.orientation = header().orientation;
     if (picture.colours.source == HeaderColours::Source::HighRange)
-        return pictureFailure(m_path, Failure::Kind::Unsupported, u"the picture has a high dynamic range"_s);
+        return DoorStatus::Hdr;
     const bool toldBefore = m_kind == PictureKind::Jpeg || m_kind == PictureKind::Png || m_kind == PictureKind::Bmp;
-    if (auto fits = checkSize(header().size.width, header().size.height); toldBefore && !fits)
-        return fits.failure();
+    if (const DoorStatus size = statusOfSize(header().size.width, header().size.height);
+        toldBefore && size != DoorStatus::Done)
+        return size;
     switch (m_kind) {
     case PictureKind::None:
-        return pictureFailure(m_path, Failure::Kind::Unsupported, u"is no picture of a known kind"_s);
+        return DoorStatus::Unsupported;
     case PictureKind::Jpeg:
-        return readJpeg(std::move(picture));
+        return readJpeg(picture);
     case PictureKind::Heif:
     case PictureKind::Avif:
-        return readHeif();
+        return readHeif(picture);
     case PictureKind::Bmp: {
         auto bitmap = readOtherPicture(*m_input);
         if (!bitmap)
-            return bitmap.failure();
+            return doorStatusOf(bitmap.failure());
         picture.image = bitmap->image();
-        return picture;
+        return DoorStatus::Done;
     }
     default:
-        return readByQt(std::move(picture));
+        return readByQt(picture);
     }
 }
 
-Result<StoredPicture> StoredPictureReader::readJpeg(StoredPicture picture) {
+DoorStatus StoredPictureReader::readJpeg(StoredPicture& picture) {
     auto reader = JpegReader::open(std::move(*m_input));
     if (!reader)
-        return reader.failure();
+        return doorStatusOf(reader.failure());
     using Pixels = SrgbConversion::Pixels;
-    const auto colours = (*reader)->colours();
-    const Pixels pixels = colours == JpegReader::Colours::Light  ? Pixels::Light
-                          : colours == JpegReader::Colours::Inks ? Pixels::Inks
-                                                                 : Pixels::InkLights;
+    const Pixels pixels = (*reader)->colours();
     // Inks whose profile is of no use are turned to light as those without one.
     const bool byProfile = pixels != Pixels::Light && picture.colours.source == HeaderColours::Source::Profile &&
                            SrgbConversion::ofProfile(picture.profile, pixels);
     auto bitmap = byProfile ? (*reader)->readStoredInks() : (*reader)->readBitmap();
     if (!bitmap)
-        return bitmap.failure();
+        return doorStatusOf(bitmap.failure());
     picture.image = std::move(bitmap->image());
     picture.pixels = byProfile ? pixels : Pixels::Light;
     if (pixels != Pixels::Light && !byProfile && picture.colours.source != HeaderColours::Source::None)
         picture.colours = {HeaderColours::Source::None, {}, true};
-    return picture;
+    return DoorStatus::Done;
 }
 
-Result<StoredPicture> StoredPictureReader::readHeif() {
+DoorStatus StoredPictureReader::readHeif(StoredPicture& picture) {
     const Handle<heif_context, heif_context_free> context(heif_context_alloc());
     heif_context_set_max_decoding_threads(context.get(), 0);
-    if (heif_context_read_from_memory_without_copy(context.get(), m_bytes.constData(),
-                                                   static_cast<std::size_t>(m_bytes.size()), nullptr)
-            .code != heif_error_Ok)
-        return damaged();
-    heif_image_handle* found = nullptr;
-    if (heif_context_get_primary_image_handle(context.get(), &found).code != heif_error_Ok)
-        return damaged();
-    const Handle<const heif_image_handle, releasePrimary> handle(found);
-    if (auto fits = checkSize(heif_image_handle_get_width(found), heif_image_handle_get_height(found)); !fits)
-        return fits.failure();
+    heif_error error = heif_context_read_from_memory_without_copy(context.get(), m_bytes.constData(),
+                                                                  static_cast<std::size_t>(m_bytes.size()), nullptr);
+    if (error.code != heif_error_Ok)
+        return statusOf(error);
+    heif_image_handle* handle = nullptr;
+    error = heif_context_get_primary_image_handle(context.get(), &handle);
+    if (error.code != heif_error_Ok)
+        return statusOf(error);
+    const Handle<const heif_image_handle, releasePrimary> handleOwner(handle);
+    if (const DoorStatus size = statusOfSize(heif_image_handle_get_width(handle), heif_image_handle_get_height(handle));
+        size != DoorStatus::Done)
+        return size;
 
-    StoredPicture picture;
-    picture.colours = heifColours(found);
+    picture.colours = heifColours(handle);
     if (picture.colours.source == HeaderColours::Source::HighRange)
-        return pictureFailure(m_path, Failure::Kind::Unsupported, u"the picture has a high dynamic range"_s);
-    if (const std::size_t size = heif_image_handle_get_raw_color_profile_size(found); size > 0) {
+        return DoorStatus::Hdr;
+    if (const std::size_t size = heif_image_handle_get_raw_color_profile_size(handle); size > 0) {
         picture.profile.resize(static_cast<qsizetype>(size));
-        (void)heif_image_handle_get_raw_color_profile(found, picture.profile.data());
+        (void)heif_image_handle_get_raw_color_profile(handle, picture.profile.data());
         PictureHeader header;
         header.profile = picture.profile;
         const HeaderColours byProfile = coloursOf(header);
@@ -201,38 +222,38 @@ Result<StoredPicture> StoredPictureReader::readHeif() {
     const Handle<heif_decoding_options, heif_decoding_options_free> options(heif_decoding_options_alloc());
     options->convert_hdr_to_8bit = 1;
     heif_image* decoded = nullptr;
-    if (heif_decode_image(found, &decoded, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, options.get()).code !=
-        heif_error_Ok)
-        return damaged();
+    error = heif_decode_image(handle, &decoded, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, options.get());
+    if (error.code != heif_error_Ok)
+        return statusOf(error);
     const Handle<const heif_image, releaseImage> image(decoded);
     int stride = 0;
     const uchar* pixels = heif_image_get_plane_readonly(decoded, heif_channel_interleaved, &stride);
-    const QImage::Format format = heif_image_handle_has_alpha_channel(found) == 0 ? QImage::Format_RGBX8888
-                                  : heif_image_handle_is_premultiplied_alpha(found) != 0
+    const QImage::Format format = heif_image_handle_has_alpha_channel(handle) == 0 ? QImage::Format_RGBX8888
+                                  : heif_image_handle_is_premultiplied_alpha(handle) != 0
                                       ? QImage::Format_RGBA8888_Premultiplied
                                       : QImage::Format_RGBA8888;
-    const QImage seen(pixels, heif_image_get_width(decoded, heif_channel_interleaved),
+    const QImage view(pixels, heif_image_get_width(decoded, heif_channel_interleaved),
                       heif_image_get_height(decoded, heif_channel_interleaved), stride, format);
     picture.image =
-        seen.convertToFormat(format == QImage::Format_RGBX8888 ? QImage::Format_RGB32 : QImage::Format_ARGB32);
-    return picture;
+        view.convertToFormat(format == QImage::Format_RGBX8888 ? QImage::Format_RGB32 : QImage::Format_ARGB32);
+    return DoorStatus::Done;
 }
 
-Result<StoredPicture> StoredPictureReader::readByQt(StoredPicture picture) {
+DoorStatus StoredPictureReader::readByQt(StoredPicture& picture) {
     if (m_kind == PictureKind::Gif && !hasWholeGifFrame(m_bytes))
-        return damaged();
+        return DoorStatus::Damaged;
     QBuffer buffer(&m_bytes);
     buffer.open(QIODevice::ReadOnly);
     QImageReader reader(&buffer, qtNameOf(m_kind));
     reader.setAutoDetectImageFormat(false);
     reader.setAutoTransform(m_kind == PictureKind::Tiff);
     if (!reader.size().isValid())
-        return damaged();
-    if (auto fits = checkSize(reader.size().width(), reader.size().height()); !fits)
-        return fits.failure();
+        return DoorStatus::Damaged;
+    if (const DoorStatus size = statusOfSize(reader.size().width(), reader.size().height()); size != DoorStatus::Done)
+        return size;
     picture.image = reader.read();
     if (picture.image.isNull())
-        return damaged();
+        return DoorStatus::Damaged;
     if (picture.colours.source == HeaderColours::Source::Profile || m_kind == PictureKind::Tiff) {
         if (picture.profile.isEmpty()) {
             PictureHeader header;
@@ -241,19 +262,7 @@ Result<StoredPicture> StoredPictureReader::readByQt(StoredPicture picture) {
             picture.colours = coloursOf(header);
         }
     }
-    return picture;
-}
-
-Result<void> StoredPictureReader::checkSize(qint64 width, qint64 height) const {
-    if (auto bounds = checkPictureBounds(m_path, width, height); !bounds)
-        return bounds;
-    if (width * height > maxDoorPixels)
-        return pictureFailure(m_path, Failure::Kind::TooLarge, u"the picture has more than 100 million pixels"_s);
-    return {};
-}
-
-Failure StoredPictureReader::damaged() const {
-    return pictureFailure(m_path, Failure::Kind::Damaged, u"this file is damaged"_s);
+    return DoorStatus::Done;
 }
 
 } // namespace lumora

@@ -1,15 +1,16 @@
 #pragma once
 
-#include "common/Result.h"
 #include "door/DoorNeed.h"
+#include "door/DoorStatus.h"
 #include "door/SrgbConversion.h"
-#include "imaging/files/JpegReader.h"
+#include "imaging/files/PictureInput.h"
 
 #include <QByteArray>
 #include <QImage>
 
 #include <filesystem>
 #include <memory>
+#include <optional>
 
 namespace lumora {
 
@@ -30,20 +31,16 @@ public:
 
     const QByteArray& bytes() const { return m_bytes; }
     const PictureHeader& header();
-    // One call uses the reader up.
-    Result<StoredPicture> read();
+    // Done, or why there is no picture. One call uses the reader up.
+    DoorStatus read(StoredPicture& picture);
 
 private:
-    explicit StoredPictureReader(const std::filesystem::path& path)
-        : m_path(path) {}
+    StoredPictureReader() = default;
 
-    Result<StoredPicture> readJpeg(StoredPicture picture);
-    Result<StoredPicture> readHeif();
-    Result<StoredPicture> readByQt(StoredPicture picture);
-    Result<void> checkSize(qint64 width, qint64 height) const;
-    Failure damaged() const;
+    DoorStatus readJpeg(StoredPicture& picture);
+    DoorStatus readHeif(StoredPicture& picture);
+    DoorStatus readByQt(StoredPicture& picture);
 
-    std::filesystem::path m_path;
     QByteArray m_bytes;
     PictureKind m_kind = PictureKind::None;
     std::optional<PictureHeader> m_header;

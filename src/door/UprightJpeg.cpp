@@ -14,8 +14,6 @@
 
 namespace lumora {
 
-using namespace Qt::StringLiterals;
-
 namespace {
 
 constexpr int turnedQuality = 97;
@@ -140,26 +138,30 @@ QImage inSrgb(StoredPicture& picture) {
 
 } // namespace
 
-Result<UprightJpeg> makeUprightJpeg(StoredPictureReader& reader) {
+DoorStatus makeUprightJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
     const PictureHeader& header = reader.header();
     const bool onlyTurned = doorNeedOf(header, {}) == DoorNeed::Turn;
-    const bool profileIgnored = coloursOf(header).profileIgnored;
+    const auto done = [](bool profileIgnored) {
+        return profileIgnored ? DoorStatus::ProfileIgnored : DoorStatus::Done;
+    };
     if (onlyTurned) {
-        if (const QByteArray bytes = turnedBlocks(reader.bytes(), header.orientation); !bytes.isEmpty())
-            return UprightJpeg{bytes, profileIgnored};
+        if (const auto bounds = checkPictureBounds({}, header.size.width, header.size.height); !bounds)
+            return doorStatusOf(bounds.failure());
+        jpeg = turnedBlocks(reader.bytes(), header.orientation);
+        if (!jpeg.isEmpty())
+            return done(coloursOf(header).profileIgnored);
     }
-    auto stored = reader.read();
-    if (!stored)
-        return stored.failure();
-    const int orientation = stored->orientation;
-    Bitmap picture = onWhite(Bitmap(inSrgb(*stored)));
-    stored->image = QImage();
-    picture = upright(std::move(picture), orientation);
-    const QByteArray bytes =
-        picture.isNull() ? QByteArray() : encoded(picture.image(), onlyTurned ? turnedQuality : decodedQuality);
-    if (bytes.isEmpty())
-        return Failure{Failure::Kind::TooLarge, u"memory is short"_s};
-    return UprightJpeg{withSmallPicture(bytes, picture), stored->colours.profileIgnored};
+    StoredPicture stored;
+    if (const DoorStatus read = reader.read(stored); read != DoorStatus::Done)
+        return read;
+    Bitmap picture = onWhite(Bitmap(inSrgb(stored)));
+    stored.image = QImage();
+    picture = upright(std::move(picture), stored.orientation);
+    jpeg = picture.isNull() ? QByteArray() : encoded(picture.image(), onlyTurned ? turnedQuality : decodedQuality);
+    if (jpeg.isEmpty())
+        return DoorStatus::TooLarge;
+    jpeg = withSmallPicture(std::move(jpeg), picture);
+    return done(stored.colours.profileIgnored);
 }
 
 } // namespace lumora

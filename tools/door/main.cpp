@@ -39,7 +39,7 @@ void complain(const QString& text) {
 
 int main(int argc, char** argv) {
     if (argc > 1 && argv[1] == doorChildOption)
-        return runDoorChild(argc, argv);
+        runDoorChild(argc, argv);
     std::vector<std::string> arguments(argv + 1, argv + argc);
     const std::string first = arguments.empty() ? std::string() : arguments.front();
     if (first == "--help" || first == "--version") {

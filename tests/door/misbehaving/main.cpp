@@ -1,14 +1,19 @@
 // Stands in for lumora-door with a decoder that an attacker has taken over: it does what the name in its source's bytes
 // says.
 
+#include "door/Confinement.h"
 #include "door/DoorChild.h"
+#include "door/DoorStatus.h"
 
 #include <fcntl.h>
+#include <signal.h>
 #include <sys/mman.h>
 #include <sys/socket.h>
+#include <sys/syscall.h>
 #include <unistd.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <map>
 #include <semaphore>
 #include <string>
@@ -20,6 +25,7 @@ using namespace lumora;
 namespace {
 
 volatile bool forEver = true;
+const pid_t parent = ::getppid();
 
 void end(std::string_view bytes) {
     _exit(::write(doorTargetNumber, bytes.data(), bytes.size()) < 0 ? 1 : 0);
@@ -30,9 +36,11 @@ void loop() {
     }
 }
 
-void eat() {
+void eat() try {
     for (std::vector<std::vector<char>> eaten; forEver;)
         eaten.emplace_back(1 << 20, 'x');
+} catch (const std::bad_alloc&) {
+    _exit(static_cast<int>(DoorStatus::TooLarge));
 }
 
 const std::map<std::string, void (*)()> deeds{
@@ -40,12 +48,13 @@ const std::map<std::string, void (*)()> deeds{
     {"loops", loop},
     {"waits", [] { std::binary_semaphore(0).acquire(); }},
     {"eats memory", eat},
-    {"writes a file", [] { (void)::open("/dev/null", O_WRONLY); }},
     {"reads a file", [] { (void)::open("/etc/passwd", O_RDONLY); }},
     {"opens the net", [] { (void)::socket(AF_INET, SOCK_STREAM, 0); }},
     {"begins a process", [] { (void)::fork(); }},
     {"runs its own code", [] { ::mmap(nullptr, 4096, PROT_EXEC, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0); }},
-    {"says done", [] { end({}); }},
+    {"aborts", std::abort},
+    {"aborts its parent", [] { ::syscall(SYS_tgkill, parent, parent, SIGABRT); }},
+    {"says that it read nothing", [] { _exit(static_cast<int>(DoorStatus::NotRead)); }},
     {"says done of rubbish", [] { end("rubbish"); }},
     {"says done of half",
      [] {
@@ -61,6 +70,8 @@ int main(int argc, char** argv) {
     std::string source(4096, '\0');
     source.resize(
         static_cast<std::size_t>(std::max<ssize_t>(0, ::pread(doorSourceNumber, source.data(), source.size(), 0))));
+    if (source.ends_with("\nis killed"))
+        ::raise(SIGKILL);
     if (!confineMyself())
         return 1;
     const std::size_t name = source.rfind('\n');
