@@ -28,6 +28,7 @@ void Preparation::begin(const QStringList& lines) {
     m_failed.clear();
     m_prints = 0;
     m_withoutPrints = false;
+    m_failedPrintStays = false;
     m_writeFailures = 0;
     m_state.transfer.leftOut = m_noJpeg;
     m_state.transfer.leftOutAsked = false;
@@ -115,7 +116,8 @@ void Preparation::removePrints() const {
         static_cast<void>(m_platform.files.removeFile(m_folder->filePath(name)));
 }
 
-// An order without its state can be sent all the same; it only can't be taken up again.
+// An order without its state can be sent all the same, it only can't be taken up again; without a thumbnail a cell of
+// its sheet stays empty.
 void Preparation::keep(const Result<void>& written) {
     if (!written)
         notWritten(written.failure());
@@ -147,6 +149,10 @@ bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
                                                                         : LeftOut::Why::Gone);
     if (outcome.writeFailure)
         notWritten(*outcome.writeFailure);
+    if (outcome.removeFailure) {
+        m_failedPrintStays = true;
+        m_events.notWritten(PreparationEvents::NotWritten::Print, *outcome.removeFailure);
+    }
     return outcome.packed;
 }
 
@@ -163,8 +169,8 @@ void Preparation::notPrepared(const DrivePath& picture, LeftOut::Why why) {
 }
 
 bool Preparation::isHeldBackForPrints() {
-    m_withoutPrints = m_state.Careful && m_prints == 0 && m_there.isEmpty();
-    return m_withoutPrints;
+    m_withoutPrints = !m_failedPrintStays && m_state.Careful && m_prints == 0 && m_there.isEmpty();
+    return m_failedPrintStays || m_withoutPrints;
 }
 
 bool Preparation::isHeldBackForSheet(const Failure& failure) {

@@ -21,7 +21,8 @@ struct Platform;
 // What the preparation of an order tells its page.
 class PreparationEvents {
 public:
-    enum class NotWritten { Folder, File, Sheet, Counter, Log };
+    // Print: a print that failed lies in the folder and can't be removed.
+    enum class NotWritten { Folder, File, Print, Sheet, Counter, Log };
 
     // position: of the picture in work, from 1.
     virtual void packing(int position) = 0;
@@ -77,7 +78,8 @@ protected:
     QSet<int> notMade() const { return m_there | m_others; }
     bool pack(PrintPacker& packer, const PrintPacker::Line& line, const std::function<Result<QByteArray>()>& picture);
     void notPrepared(const DrivePath& picture, LeftOut::Why why);
-    // The order is held back: it has no print file, or no sheet. As built in, it goes on.
+    // The order is held back: it has a print that failed, no print file, or no sheet. As built in, it goes on in the
+    // last two cases.
     bool isHeldBackForPrints();
     bool isHeldBackForSheet(const Failure& failure);
     void notWritten(const Failure& failure);
@@ -111,6 +113,7 @@ private:
     QSet<int> m_others;                    // indices of the lines with another picture in their place
     int m_prints = 0;                      // print files that this preparation has made
     bool m_withoutPrints = false;
+    bool m_failedPrintStays = false;
     int m_writeFailures = 0;
     bool m_goesOn = false;
     DrivePath m_replaced; // folder of the order that this one is prepared again from, or empty

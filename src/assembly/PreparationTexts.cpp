@@ -35,6 +35,12 @@ void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
     case NotWritten::File:
         return tell(u"קובץ של ההזמנה לא נכתב. מה שכבר הוכן נשמר."_s,
                     u"A file of the order could not be written. What was prepared so far is kept."_s, failure.message);
+    case NotWritten::Print:
+        return tell(u"תמונה שהכנתה נכשלה נשארה בתיקיית ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. "
+                    u"תקן ונסה שוב."_s,
+                    u"A print that failed can't be removed from the order, so the order was not sent. What was "
+                    u"prepared is kept. Put it right, then try again."_s,
+                    failure.message);
     case NotWritten::Sheet:
         return tell(u"לא ניתן לכתוב את דף ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
                     u"The order sheet can't be written, so the order was not sent. What was prepared is kept. "

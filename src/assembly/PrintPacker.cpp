@@ -28,29 +28,28 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
     if (const Result<void> gone = m_files.fileExists(m_scratch) ? m_files.removeFile(m_scratch) : Result<void>();
         !gone) {
         static_cast<void>(picture()); // a print that was made ahead must not come in the next step
-        return {false, gone.failure()};
+        return {false, gone.failure(), {}};
     }
     const Result<QByteArray> made = picture();
     if (!made)
         return {};
     if (const Result<void> written = m_files.writeWhole(m_scratch, *made); !written)
-        return {false, written.failure()};
+        return {false, written.failure(), {}};
 
     const QString base = PrintBaseName(line.path);
     m_manifestLine = QString::number(made->size()) + u">>"_s + line.code + QString::number(m_runningNumber) + u'_' +
                      base + u".jpg\r\n"_s;
     if (!m_folderThere)
-        return {false, m_folderThere.failure()};
+        return {false, m_folderThere.failure(), {}};
     const Result<QByteArray> packed = packPrintFile(*made, m_shape, m_tail.form(m_tailForm, base));
     const DrivePath print =
         m_folder.filePath(PrintFileName{line.code, line.index, static_cast<int>(m_state.Optint), base}.text());
     const Result<void> written = packed ? m_files.writeWhole(print, *packed) : Result<void>(packed.failure());
     if (written)
-        return {true, {}};
+        return {true, {}, {}};
     // What the log names as failed must not be sent.
-    if (m_files.fileExists(print))
-        static_cast<void>(m_files.removeFile(print));
-    return {false, written.failure()};
+    const Result<void> removed = m_files.fileExists(print) ? m_files.removeFile(print) : Result<void>();
+    return {false, written.failure(), removed ? std::optional<Failure>() : removed.failure()};
 }
 
 void PrintPacker::removeScratch() const {

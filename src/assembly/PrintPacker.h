@@ -37,6 +37,8 @@ public:
         bool packed = false;
         // Set when a file of the order could not be written, not for a picture that can't be read.
         std::optional<Failure> writeFailure;
+        // Set when what was written of such a print can't be removed: the order must not be sent with it.
+        std::optional<Failure> removeFailure;
     };
     // Removes the scratch picture of the step before, makes a new one by picture() and writes its print file. If
     // picture() fails there is no scratch picture, so that no picture is printed as the one before it.

@@ -80,6 +80,18 @@ TEST_F(GoingOnWithAnOrder, MakesTheSameOrderAndNoPrintTwice) {
     }
 }
 
+TEST_F(GoingOnWithAnOrder, TellsAPrintThatGivesTheSheetNoThumbnail) {
+    QStringList items;
+    for (int i = 0; i < 4; ++i)
+        items += edited(givePicture(u"picture%1.jpg"_s.arg(i)));
+    prepareAndKill(true, items);
+    const QString cut = printFiles().value(1);
+    write(folder() / cut, "cut");
+    fs::remove(host(folder() / u".kept\\job_folder\\1 ~picture1.bmp"));
+    goOn();
+    EXPECT_TRUE(machine.dialogs.messages.value(0).contains(cut)) << machine.dialogs.messages.join(u'|').toStdString();
+}
+
 TEST_F(GoingOnWithAnOrder, MakesAllPrintsAnewInAnotherShapeAndCountsAPictureThatIsGoneAsFailed) {
     QStringList paths;
     for (int i = 0; i < 4; ++i)

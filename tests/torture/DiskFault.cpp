@@ -14,12 +14,14 @@ namespace {
 std::atomic<int> calls{0};
 std::atomic<int> failing{0};
 std::atomic<int> synced{0};
-std::atomic<bool> full{false};
+std::atomic<lumora::DiskFault::Kind> kindOfFault{};
 
 bool fails(bool takesSpace) {
     const int nth = failing;
     const int call = ++calls;
-    if (nth == 0 || call < nth || (call > nth && !(full && takesSpace)))
+    const bool full = kindOfFault == lumora::DiskFault::Kind::FullDisk;
+    const bool again = full ? takesSpace : kindOfFault == lumora::DiskFault::Kind::Twice && call == nth + 1;
+    if (nth == 0 || call < nth || (call > nth && !again))
         return false;
     errno = full || nth % 2 == 1 ? ENOSPC : EIO;
     return true;
@@ -81,7 +83,7 @@ int __wrap_unlink(const char* path) {
 namespace lumora {
 
 DiskFault::DiskFault(int nth, Kind kind) {
-    full = kind == Kind::FullDisk;
+    kindOfFault = kind;
     calls = synced = 0;
     failing = nth;
 }

@@ -33,6 +33,7 @@ TEST_F(PreparingOnAFailingDisk, EndsWithAWholeOrderOrSaysWhatItLacksAndMakesItWh
                                                {false, true, Once},
                                                {true, false, Once},
                                                {true, true, Once},
+                                               {false, true, Twice},
                                                {false, false, FullDisk},
                                                {true, true, FullDisk}}) {
         QStringList items;

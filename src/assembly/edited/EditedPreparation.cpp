@@ -106,15 +106,17 @@ Result<void> EditedPreparation::keepToneCopy(const BasketLine& line, NewContent&
 void EditedPreparation::remakeThumbnail(int index, const BasketLine& line, const DrivePath& scratch) {
     if (m_platform.files.fileExists(thumbnailPath(line)))
         return;
-    const Result<QByteArray> bytes =
-        m_platform.files.read(m_folder->filePath(PrintNameOf(line, index, OrderKind::EditedPrint)));
-    const Result<PrintFileContent> print =
-        bytes ? readPrintFile(*bytes, PrintFileShape::of(m_state.profile)) : Result<PrintFileContent>(bytes.failure());
-    const Result<void> written = print ? m_platform.files.writePassing(scratch, print->picture) : print.failure();
+    const DrivePath path = m_folder->filePath(PrintNameOf(line, index, OrderKind::EditedPrint));
+    const Result<QByteArray> bytes = m_platform.files.read(path);
+    if (!bytes)
+        return keep(bytes.failure());
+    const Result<PrintFileContent> print = readPrintFile(*bytes, PrintFileShape::of(m_state.profile));
+    if (!print)
+        return keep(Failure{print.failure().kind, u"%1: %2"_s.arg(path.text(), print.failure().message)});
+    const Result<void> written = m_platform.files.writePassing(scratch, print->picture);
+    keep(written);
     if (written)
         saveThumbnail(line, scratch);
-    else if (print)
-        keep(written);
 }
 
 DrivePath EditedPreparation::thumbnailPath(const BasketLine& line) const {
@@ -137,7 +139,6 @@ void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& s
     m_events.printed(*preview);
     NewContent thumbnail(*target, path.text());
     appendBmp(*preview, thumbnail, [] { return false; });
-    // Without a thumbnail the picture's cell of the sheet stays empty.
     const Result<void> saved = thumbnail.commit(NewContent::Durability::Passing);
     keep(saved ? kept().keepThumbnail(path) : saved);
 }
