@@ -55,7 +55,6 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(report->prints, 2);
 }
 
-// Flat pictures, so that one pixel tells which picture was printed and in which colours.
 TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
     const QString bad = giveFile(u"bad_1.jpg"_s, "no picture");
     for (const bool careful : {false, true}) {
@@ -69,6 +68,7 @@ TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
     }
 }
 
+// Flat pictures, so that one pixel tells which picture was printed and in which colours.
 TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     const QColor first(200, 80, 20), second(20, 160, 120), fixed(60, 60, 200);
     const auto grey = [](QColor colour) {

@@ -84,7 +84,7 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     ASSERT_TRUE(test.files.writeWhole(
         lacks.logPath(),
         OrderLog::of(session, OrderLog::Layout::Plain, again.items, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
-    // The other one was sent after all.
+    // 109 was sent after all.
     OrderState late = inPhase(Phase::Prepared, u"110"_s);
     late.replaces = u"2026_11_20_KUP_1234^109"_s;
     give(late.replaces, inPhase(Phase::Sending, u"109"_s), {print});

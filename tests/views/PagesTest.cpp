@@ -15,10 +15,14 @@
 
 namespace lumora {
 
-TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {
-    Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
+TEST(CarefulProgram, HoldsItsDataFolderAlone) {
+    Walk walk(QSize(1280, 800), u"[Guards]\nCareful = yes\n"_s);
     const HostPath data = walk.program().platform().files.drives().dataFolder();
     EXPECT_TRUE(Instances(data, Instances::Lock::Shared).refused()) << "two programs would write one order";
+}
+
+TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {
+    Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
     go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! Text2=Dana Text3=+1-212-555-01234"_s);
     lookAtPicker(walk, u"nnn"_s, u"Command12"_s, u"06-long-telephone"_s, u"messageNo"_s);
