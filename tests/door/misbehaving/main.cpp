@@ -55,7 +55,7 @@ const std::map<std::string, void (*)()> deeds{
     {"aborts", std::abort},
     {"aborts its parent", [] { ::syscall(SYS_tgkill, parent, parent, SIGABRT); }},
     {"says that it read nothing", [] { _exit(static_cast<int>(DoorStatus::NotRead)); }},
-    {"says done of rubbish", [] { end("rubbish"); }},
+    {"says done of rubbish", [] { end("rubbish\xFF\xD9"); }},
     {"says done of half",
      [] {
          end({"\xFF\xD8\xFF\xC0\0\x0B\x08\0\x08\0\x08\x01\x01\x11\0\xFF\xDA", 17});
