@@ -369,7 +369,7 @@ TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
 }
 
 TEST_F(DoorTest, ADecoderEndsWithItsParentAndBeginsForNoOther) {
-    const std::string source = "3<'" + write("source", m_carrier + "waits").string() + "' 4>/dev/null ";
+    const std::string source = "3<'" + write("source", m_carrier + "waits").string() + "' 4>/dev/null >&4 2>&4 ";
     const std::string parent = "'" LUMORA_DOOR_MISBEHAVING "' --child 60 1073741824 $$ " + source + "& echo $! >'" +
                                in("id").string() + "'; until grep -q 'Seccomp:.2' /proc/$!/status; do :; done; " +
                                "kill -KILL $$";
