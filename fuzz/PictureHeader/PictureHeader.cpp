@@ -16,7 +16,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
             std::abort();
         return at < bytes.size() ? bytes.mid(at, count) : QByteArray();
     }));
-    const auto& small = header.smallPicture;
+    const auto& small = header.thumbnail;
     if (small.at < 0 || small.length < 0 || small.at + small.length > bytes.size())
         std::abort();
     if (header.orientation < 1 || header.orientation > 8 || (header.profileBroken && !header.profile.isEmpty()))

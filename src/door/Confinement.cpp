@@ -28,14 +28,14 @@ struct FilterReleaser {
     void operator()(void* filter) const { seccomp_release(filter); }
 };
 
-constexpr const char* always =
+constexpr const char* allowedCalls =
     "read pread64 write lseek close munmap mremap madvise brk futex set_robust_list rseq gettid "
     "getpid sched_yield sched_getaffinity sysinfo rt_sigprocmask rt_sigaction rt_sigreturn "
     "sigaltstack clock_gettime gettimeofday getrandom eventfd2 poll exit exit_group";
 
 } // namespace
 
-bool limitMyself(const DoorLimits& limits, int parent) {
+bool setLimits(const DoorLimits& limits, int parent) {
     // Addresses count: each thread of a decoder would take 8 MiB of them for its stack and 64 MiB for memory of its
     // own.
     pthread_attr_t attributes;
@@ -53,13 +53,13 @@ bool limitMyself(const DoorLimits& limits, int parent) {
            limit(RLIMIT_FSIZE, memory, memory) && limit(RLIMIT_CORE, 0, 0);
 }
 
-bool confineMyself() {
+bool enterSandbox() {
     const std::unique_ptr<void, FilterReleaser> owner(seccomp_init(SCMP_ACT_KILL_PROCESS));
     if (!owner)
         return false;
     scmp_filter_ctx filter = owner.get();
     bool ok = seccomp_attr_set(filter, SCMP_FLTATR_CTL_TSYNC, 1) == 0;
-    for (const QByteArray& call : QByteArray(always).split(' '))
+    for (const QByteArray& call : QByteArray(allowedCalls).split(' '))
         ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, seccomp_syscall_resolve_name(call.constData()), 0) == 0;
     if (!memoryIsLimited)
         ok = ok && seccomp_rule_add(filter, SCMP_ACT_ALLOW, SCMP_SYS(pipe2), 0) == 0;

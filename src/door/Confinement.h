@@ -20,11 +20,11 @@ struct DoorLimits {
 
 // Limits of this process: processor seconds and memory, no files of dumps; it ends with the parent, the process that
 // started it, and this fails where the parent has ended already.
-bool limitMyself(const DoorLimits& limits, int parent);
+bool setLimits(const DoorLimits& limits, int parent);
 
 // From here on this process may compute, take memory within its limit, begin threads, read and write what is open, and
 // end. Any other call of the system kills it, but clone3, which fails as on an older system: no file is opened, no
 // line, no program begun.
-bool confineMyself();
+bool enterSandbox();
 
 } // namespace lumora

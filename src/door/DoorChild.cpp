@@ -29,7 +29,7 @@ DoorStatus decode() try {
     auto reader = StoredPictureReader::open("/proc/self/fd/" + std::to_string(doorSourceNumber));
     if (!reader)
         return doorStatusOf(reader.failure());
-    if (!confineMyself())
+    if (!enterSandbox())
         return DoorStatus::NotConfined;
     QByteArray jpeg;
     const DoorStatus made = makeUprightJpeg(**reader, jpeg);
@@ -44,7 +44,7 @@ bool limitDoorChild(int argc, char** argv) {
     if (argc != 5)
         return false;
     const DoorLimits limits{std::atoi(argv[2]), std::atoll(argv[3])};
-    return limits.seconds > 0 && limits.memory > 0 && limitMyself(limits, std::atoi(argv[4]));
+    return limits.seconds > 0 && limits.memory > 0 && setLimits(limits, std::atoi(argv[4]));
 }
 
 // Ends without the destructors of what is left, which the confined process may not all run.

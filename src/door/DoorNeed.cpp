@@ -12,22 +12,22 @@ using Source = HeaderColours::Source;
 
 constexpr int unspecified = 2;
 
-struct CodedLights {
+struct CodedPrimaries {
     int code;
     Chromaticity white;
     std::array<Chromaticity, 3> primaries;
 };
 
-constexpr Chromaticity daylight{0.3127, 0.3290};
-constexpr CodedLights codedLights[] = {
+constexpr Chromaticity d65{0.3127, 0.3290};
+constexpr CodedPrimaries codedPrimaries[] = {
     {4, {0.310, 0.316}, {{{0.67, 0.33}, {0.21, 0.71}, {0.14, 0.08}}}},
-    {5, daylight, {{{0.64, 0.33}, {0.29, 0.60}, {0.15, 0.06}}}},
-    {6, daylight, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
-    {7, daylight, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
-    {9, daylight, {{{0.708, 0.292}, {0.170, 0.797}, {0.131, 0.046}}}},
+    {5, d65, {{{0.64, 0.33}, {0.29, 0.60}, {0.15, 0.06}}}},
+    {6, d65, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
+    {7, d65, {{{0.630, 0.340}, {0.310, 0.595}, {0.155, 0.070}}}},
+    {9, d65, {{{0.708, 0.292}, {0.170, 0.797}, {0.131, 0.046}}}},
     {11, {0.314, 0.351}, {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}}},
-    {12, daylight, {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}}},
-    {22, daylight, {{{0.630, 0.340}, {0.295, 0.605}, {0.155, 0.077}}}},
+    {12, d65, {{{0.680, 0.320}, {0.265, 0.690}, {0.150, 0.060}}}},
+    {22, d65, {{{0.630, 0.340}, {0.295, 0.605}, {0.155, 0.077}}}},
 };
 
 HeaderColours named(const PictureColours& colours) {
@@ -38,14 +38,14 @@ HeaderColours named(const PictureColours& colours) {
 
 HeaderColours codedColours(PictureHeader::CodedColours coded) {
     PictureColours colours;
-    for (const CodedLights& lights : codedLights) {
-        if (lights.code == coded.primaries) {
-            colours.white = lights.white;
-            colours.primaries = lights.primaries;
+    for (const CodedPrimaries& known : codedPrimaries) {
+        if (known.code == coded.primaries) {
+            colours.white = known.white;
+            colours.primaries = known.primaries;
         }
     }
     using Curve = PictureColours::Curve;
-    switch (coded.curve) {
+    switch (coded.transfer) {
     case 1:
     case 6:
     case 14:
@@ -56,11 +56,11 @@ HeaderColours codedColours(PictureHeader::CodedColours coded) {
     case 5:
     case 8:
         colours.curve = Curve::Gamma;
-        colours.gamma = coded.curve == 4 ? 2.2 : coded.curve == 5 ? 2.8 : 1;
+        colours.gamma = coded.transfer == 4 ? 2.2 : coded.transfer == 5 ? 2.8 : 1;
         break;
     case 16:
     case 18:
-        return {Source::HighRange, {}, false};
+        return {Source::Hdr, {}, false};
     default:
         break;
     }
@@ -70,7 +70,7 @@ HeaderColours codedColours(PictureHeader::CodedColours coded) {
 
 HeaderColours coloursOf(const PictureHeader& header) {
     bool broken = header.profileBroken;
-    if (header.coded && header.coded->primaries != unspecified && header.coded->curve != unspecified)
+    if (header.coded && header.coded->primaries != unspecified && header.coded->transfer != unspecified)
         return codedColours(*header.coded);
     if (header.packedProfile)
         return {Source::Profile, {}, false};

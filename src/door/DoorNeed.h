@@ -18,7 +18,7 @@ enum class DoorNeed {
 
 // The colours of a picture by its header, the strongest word first: PNG's codes, profile, named colours, EXIF.
 struct HeaderColours {
-    enum class Source { None, Profile, Named, HighRange } source = Source::None;
+    enum class Source { None, Profile, Named, Hdr } source = Source::None;
     PictureColours named;
     bool profileIgnored = false;
 };

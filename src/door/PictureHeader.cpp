@@ -18,9 +18,9 @@ constexpr qint64 maxExif = 1 << 20;
 constexpr QByteArrayView exifMark("Exif\0\0", 6);
 
 // Numbers of a byte sequence; a byte that lies outside is 0.
-class Fields {
+class ByteReader {
 public:
-    explicit Fields(QByteArray bytes, bool littleEndian = false)
+    explicit ByteReader(QByteArray bytes, bool littleEndian = false)
         : m_bytes(std::move(bytes))
         , m_littleEndian(littleEndian) {}
 
@@ -44,24 +44,24 @@ private:
 class Exif {
 public:
     explicit Exif(const QByteArray& tiff)
-        : m_fields(isTiff(tiff) ? tiff : QByteArray(), tiff.startsWith("II")) {}
+        : m_reader(isTiff(tiff) ? tiff : QByteArray(), tiff.startsWith("II")) {}
 
     int orientation() const {
-        const int value = m_fields.word(valueOf(first(), 0x0112));
+        const int value = m_reader.word(valueOf(first(), 0x0112));
         return value >= 1 && value <= 8 ? value : 1;
     }
 
     bool isAdobeRgb() const {
-        const qint64 camera = m_fields.number(valueOf(first(), 0x8769));
-        const qint64 exchange = m_fields.number(valueOf(camera, 0xA005));
-        return m_fields.text(valueOf(exchange, 0x0001), 3) == "R03";
+        const qint64 camera = m_reader.number(valueOf(first(), 0x8769));
+        const qint64 exchange = m_reader.number(valueOf(camera, 0xA005));
+        return m_reader.text(valueOf(exchange, 0x0001), 3) == "R03";
     }
 
-    PictureHeader::Place smallPicture() const {
-        const qint64 second = m_fields.number(first() + 2 + 12 * m_fields.word(first()));
-        const PictureHeader::Place place{m_fields.number(valueOf(second, 0x0201)),
-                                         m_fields.number(valueOf(second, 0x0202))};
-        const bool isThere = place.length >= 4 && m_fields.text(place.at, place.length).startsWith("\xFF\xD8\xFF");
+    PictureHeader::Place thumbnail() const {
+        const qint64 second = m_reader.number(first() + 2 + 12 * m_reader.word(first()));
+        const PictureHeader::Place place{m_reader.number(valueOf(second, 0x0201)),
+                                         m_reader.number(valueOf(second, 0x0202))};
+        const bool isThere = place.length >= 4 && m_reader.text(place.at, place.length).startsWith("\xFF\xD8\xFF");
         return isThere ? place : PictureHeader::Place();
     }
 
@@ -71,19 +71,19 @@ private:
     static bool isTiff(QByteArrayView bytes) {
         return bytes.startsWith(QByteArrayView("II*\0", 4)) || bytes.startsWith(QByteArrayView("MM\0*", 4));
     }
-    qint64 first() const { return m_fields.number(4); }
+    qint64 first() const { return m_reader.number(4); }
 
     qint64 valueOf(qint64 directory, int tag) const {
-        const int count = directory >= 8 ? m_fields.word(directory) : 0;
+        const int count = directory >= 8 ? m_reader.word(directory) : 0;
         for (int i = 0; i < count; ++i) {
             const qint64 entry = directory + 2 + 12 * i;
-            if (m_fields.word(entry) == tag)
+            if (m_reader.word(entry) == tag)
                 return entry + 8;
         }
         return outside;
     }
 
-    Fields m_fields;
+    ByteReader m_reader;
 };
 
 void takeExif(const Exif& exif, PictureHeader& header) {
@@ -95,7 +95,7 @@ void takeExif(const Exif& exif, PictureHeader& header) {
 class ProfileParts {
 public:
     void add(const QByteArray& body) {
-        const Fields fields(body);
+        const ByteReader fields(body);
         const int number = fields.byte(12);
         m_total = fields.byte(13);
         m_size += body.size();
@@ -125,7 +125,7 @@ void readJpeg(const PictureBytes& bytes, PictureHeader& header) {
     bool exifSeen = false;
     qint64 at = 2;
     for (int i = 0; i < maxParts; ++i) {
-        const Fields head(bytes.part(at, 4));
+        const ByteReader head(bytes.part(at, 4));
         const int marker = head.byte(1);
         if (head.byte(0) != 0xFF || marker == 0xD9 || marker == 0xDA)
             break;
@@ -141,15 +141,15 @@ void readJpeg(const PictureBytes& bytes, PictureHeader& header) {
         const QByteArray content =
             isFrame || marker == 0xE1 || marker == 0xE2 ? bytes.part(body, length) : QByteArray();
         if (isFrame) {
-            const Fields frame(content);
+            const ByteReader frame(content);
             header.size = {frame.word(3), frame.word(1)};
         } else if (!exifSeen && content.startsWith(exifMark)) {
             exifSeen = true;
             const Exif exif(content.sliced(exifMark.size()));
             takeExif(exif, header);
-            header.smallPicture = exif.smallPicture();
-            if (header.smallPicture.length > 0)
-                header.smallPicture.at += body + exifMark.size();
+            header.thumbnail = exif.thumbnail();
+            if (header.thumbnail.length > 0)
+                header.thumbnail.at += body + exifMark.size();
         } else if (content.size() >= 14 && content.startsWith(QByteArrayView("ICC_PROFILE\0", 12))) {
             profile.add(content);
         }
@@ -160,7 +160,7 @@ void readJpeg(const PictureBytes& bytes, PictureHeader& header) {
 
 PictureColours namedByPng(const std::optional<qint64>& gamma, const QByteArray& lights) {
     PictureColours colours;
-    const Fields fields(lights);
+    const ByteReader fields(lights);
     const auto light = [&fields](int i) {
         return Chromaticity{double(fields.number(8 * i)) / 100000, double(fields.number(8 * i + 4)) / 100000};
     };
@@ -185,13 +185,13 @@ void readPng(const PictureBytes& bytes, PictureHeader& header) {
         const QByteArray head = bytes.part(at, 8);
         if (head.isEmpty())
             break;
-        const Fields fields(head);
+        const ByteReader fields(head);
         const qint64 length = fields.number(0);
         const QByteArrayView name = fields.text(4, 4);
         ++(name == "IDAT" ? dataParts : parts);
         const auto content = [&](qint64 wanted) { return bytes.part(at + 8, wanted); };
         if (name == "IHDR") {
-            const Fields sides(content(8));
+            const ByteReader sides(content(8));
             header.size = {static_cast<int>(sides.number(0) & 0x7FFFFFFF),
                            static_cast<int>(sides.number(4) & 0x7FFFFFFF)};
         } else if (name == "iCCP") {
@@ -199,11 +199,11 @@ void readPng(const PictureBytes& bytes, PictureHeader& header) {
         } else if (name == "sRGB") {
             isSrgb = true;
         } else if (name == "gAMA") {
-            gamma = Fields(content(4)).number(0);
+            gamma = ByteReader(content(4)).number(0);
         } else if (name == "cHRM") {
             lights = content(32);
         } else if (name == "cICP") {
-            const Fields codes(content(2));
+            const ByteReader codes(content(2));
             header.coded = {codes.byte(0), codes.byte(1)};
         } else if (name == "eXIf" && length <= maxExif) {
             takeExif(Exif(content(length)), header);
@@ -220,7 +220,7 @@ void readWebP(const PictureBytes& bytes, PictureHeader& header) {
         const QByteArray head = bytes.part(at, 8);
         if (head.isEmpty())
             break;
-        const Fields fields(head, true);
+        const ByteReader fields(head, true);
         const qint64 length = fields.number(4);
         if (fields.text(0, 4) == "ICCP" && length <= maxProfile) {
             header.profile = bytes.part(at + 8, length);
@@ -233,7 +233,7 @@ void readWebP(const PictureBytes& bytes, PictureHeader& header) {
 }
 
 PictureSize bmpSize(const PictureBytes& bytes) {
-    const Fields fields(bytes.head().first(std::min<qsizetype>(bytes.head().size(), 26)).toByteArray(), true);
+    const ByteReader fields(bytes.head().first(std::min<qsizetype>(bytes.head().size(), 26)).toByteArray(), true);
     if (fields.number(14) == 12)
         return {fields.word(18), fields.word(20)};
     const auto side = [&fields](qint64 at) {

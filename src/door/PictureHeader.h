@@ -34,7 +34,7 @@ struct PictureHeader {
     // As ISO/IEC 23091-2 numbers them: PNG's cICP, and the nclx of HEIC and AVIF.
     struct CodedColours {
         int primaries = 0;
-        int curve = 0;
+        int transfer = 0;
     };
     struct Place {
         qint64 at = 0;
@@ -50,7 +50,7 @@ struct PictureHeader {
     bool packedProfile = false; // PNG's, which only its decoder unpacks
     std::optional<CodedColours> coded;
     std::optional<PictureColours> named; // PNG's gAMA and cHRM
-    Place smallPicture;                  // the JPEG file in the EXIF of a JPEG file
+    Place thumbnail;                     // the JPEG file in the EXIF of a JPEG file
 };
 
 PictureHeader readPictureHeader(const PictureBytes& bytes);

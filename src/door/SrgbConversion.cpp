@@ -61,13 +61,13 @@ std::optional<SrgbConversion> SrgbConversion::ofProfile(const QByteArray& profil
     conversion.m_pixels = pixels;
     conversion.m_grey = space == cmsSigGrayData;
     auto transforms = std::make_shared<Transforms>();
-    if (pixels == Pixels::Light && conversion.m_grey) {
+    if (pixels == Pixels::Rgb && conversion.m_grey) {
         transforms->ordinary = transformOf(source.get(), TYPE_GRAYA_16, true);
-    } else if (pixels == Pixels::Light && space == cmsSigRgbData) {
+    } else if (pixels == Pixels::Rgb && space == cmsSigRgbData) {
         transforms->ordinary = transformOf(source.get(), pixelFormat, true);
         transforms->deep = transformOf(source.get(), TYPE_RGBA_16, true);
-    } else if (pixels != Pixels::Light && space == cmsSigCmykData) {
-        transforms->ordinary = transformOf(source.get(), pixels == Pixels::Inks ? TYPE_CMYK_8 : TYPE_CMYK_8_REV, false);
+    } else if (pixels != Pixels::Rgb && space == cmsSigCmykData) {
+        transforms->ordinary = transformOf(source.get(), pixels == Pixels::Cmyk ? TYPE_CMYK_8 : TYPE_CMYK_8_REV, false);
     }
     if (!transforms->ordinary)
         return {};
@@ -104,8 +104,8 @@ std::optional<SrgbConversion> SrgbConversion::ofColours(const PictureColours& co
 }
 
 QImage SrgbConversion::converted(QImage picture) const {
-    const bool alpha = m_pixels == Pixels::Light && picture.hasAlphaChannel();
-    const bool deep = m_pixels == Pixels::Light && (m_grey || isDeep(picture));
+    const bool alpha = m_pixels == Pixels::Rgb && picture.hasAlphaChannel();
+    const bool deep = m_pixels == Pixels::Rgb && (m_grey || isDeep(picture));
     const QImage::Format format = alpha ? QImage::Format_ARGB32 : QImage::Format_RGB32;
     picture.convertTo(deep ? QImage::Format_RGBA64 : format);
     if (picture.isNull())

@@ -31,7 +31,7 @@ private:
     struct Transforms;
     std::shared_ptr<const Transforms> m_transforms;
     bool m_grey = false;
-    Pixels m_pixels = Pixels::Light;
+    Pixels m_pixels = Pixels::Rgb;
 };
 
 } // namespace lumora

@@ -144,7 +144,7 @@ DoorStatus StoredPictureReader::read(StoredPicture& picture) {
     picture.colours = coloursOf(header());
     picture.profile = header().profile;
     picture.orientation = header().orientation;
-    if (picture.colours.source == HeaderColours::Source::HighRange)
+    if (picture.colours.source == HeaderColours::Source::Hdr)
         return DoorStatus::Hdr;
     const bool toldBefore = m_kind == PictureKind::Jpeg || m_kind == PictureKind::Png || m_kind == PictureKind::Bmp;
     if (const DoorStatus size = statusOfSize(header().size.width, header().size.height);
@@ -177,14 +177,14 @@ DoorStatus StoredPictureReader::readJpeg(StoredPicture& picture) {
     using Pixels = SrgbConversion::Pixels;
     const Pixels pixels = (*reader)->colours();
     // Inks whose profile is of no use are turned to light as those without one.
-    const bool byProfile = pixels != Pixels::Light && picture.colours.source == HeaderColours::Source::Profile &&
+    const bool byProfile = pixels != Pixels::Rgb && picture.colours.source == HeaderColours::Source::Profile &&
                            SrgbConversion::ofProfile(picture.profile, pixels);
     auto bitmap = byProfile ? (*reader)->readStoredInks() : (*reader)->readBitmap();
     if (!bitmap)
         return doorStatusOf(bitmap.failure());
     picture.image = std::move(bitmap->image());
-    picture.pixels = byProfile ? pixels : Pixels::Light;
-    if (pixels != Pixels::Light && !byProfile && picture.colours.source != HeaderColours::Source::None)
+    picture.pixels = byProfile ? pixels : Pixels::Rgb;
+    if (pixels != Pixels::Rgb && !byProfile && picture.colours.source != HeaderColours::Source::None)
         picture.colours = {HeaderColours::Source::None, {}, true};
     return DoorStatus::Done;
 }
@@ -206,7 +206,7 @@ DoorStatus StoredPictureReader::readHeif(StoredPicture& picture) {
         return size;
 
     picture.colours = heifColours(handle);
-    if (picture.colours.source == HeaderColours::Source::HighRange)
+    if (picture.colours.source == HeaderColours::Source::Hdr)
         return DoorStatus::Hdr;
     if (const std::size_t size = heif_image_handle_get_raw_color_profile_size(handle); size > 0) {
         picture.profile.resize(static_cast<qsizetype>(size));

@@ -17,7 +17,7 @@ namespace lumora {
 // A picture as its file stores it: turned only where the format's own decoder turns, in its own colours.
 struct StoredPicture {
     QImage image;
-    SrgbConversion::Pixels pixels = SrgbConversion::Pixels::Light;
+    SrgbConversion::Pixels pixels = SrgbConversion::Pixels::Rgb;
     HeaderColours colours;
     QByteArray profile; // where the colours come by one
     int orientation = 1;

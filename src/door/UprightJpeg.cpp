@@ -63,7 +63,7 @@ QByteArray encoded(const QImage& picture, int quality) {
 }
 
 // The segment of a small picture: an EXIF directory that says "upright", and a second one with the picture's place.
-QByteArray smallPictureSegment(const QByteArray& small) {
+QByteArray thumbnailSegment(const QByteArray& small) {
     QByteArray bytes;
     const auto word = [&bytes](int value) {
         bytes += static_cast<char>(value >> 8);
@@ -100,11 +100,10 @@ QByteArray smallPictureSegment(const QByteArray& small) {
     return bytes + small;
 }
 
-QByteArray withSmallPicture(QByteArray jpeg, const Bitmap& picture) {
+QByteArray withThumbnail(QByteArray jpeg, const Bitmap& picture) {
     const PictureSize size = smallPictureSize({picture.width(), picture.height()}, smallCell);
     const Bitmap small = resampled(picture, size);
-    const QByteArray segment =
-        smallPictureSegment(small.isNull() ? QByteArray() : encoded(small.image(), smallQuality));
+    const QByteArray segment = thumbnailSegment(small.isNull() ? QByteArray() : encoded(small.image(), smallQuality));
     constexpr qsizetype largestSegment = 2 + 65535;
     // Behind the segment that the encoder begins with.
     const qsizetype at = 4 + qFromBigEndian<quint16>(jpeg.constData() + 4);
@@ -160,7 +159,7 @@ DoorStatus makeUprightJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
     jpeg = picture.isNull() ? QByteArray() : encoded(picture.image(), onlyTurned ? turnedQuality : decodedQuality);
     if (jpeg.isEmpty())
         return DoorStatus::TooLarge;
-    jpeg = withSmallPicture(std::move(jpeg), picture);
+    jpeg = withThumbnail(std::move(jpeg), picture);
     return done(stored.colours.profileIgnored);
 }
 

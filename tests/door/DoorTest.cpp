@@ -248,7 +248,7 @@ TEST_F(DoorTest, EveryOrientationComesOutUpright) {
                 const QByteArray result = made(file);
                 const QImage found = QImage::fromData(result);
                 ASSERT_EQ(found.size(), size);
-                const PictureHeader::Place small = headerOf(result).smallPicture;
+                const PictureHeader::Place small = headerOf(result).thumbnail;
                 // What is encoded anew has a small picture.
                 EXPECT_EQ(small.length == 0 ? asStored : jpegQuality(result.mid(small.at + small.length)), quality);
                 int far = 0;
@@ -300,12 +300,12 @@ TEST_F(DoorTest, TheSmallPictureInTheHeaderIsFoundAndWritten) {
     const QByteArray small = saved(patches(32, 24), "JPG");
     const QByteArray camera = jpegWith(saved(patches(64, 48), "JPG"), exif(3, false, small));
     const PictureHeader header = headerOf(camera);
-    EXPECT_EQ(camera.mid(header.smallPicture.at, header.smallPicture.length), small);
+    EXPECT_EQ(camera.mid(header.thumbnail.at, header.thumbnail.length), small);
     EXPECT_EQ(header.size, (PictureSize{64, 48}));
 
     const QByteArray result = made(saved(patches(320, 240), "PNG"));
     const PictureHeader own = headerOf(result);
-    const QImage drawn = QImage::fromData(result.mid(own.smallPicture.at, own.smallPicture.length));
+    const QImage drawn = QImage::fromData(result.mid(own.thumbnail.at, own.thumbnail.length));
     ASSERT_EQ(drawn.size(), QSize(160, 120));
     expectColours(saved(drawn, "JPG"), labOf({}, middlesOf(patches(320, 240))));
 }

@@ -185,8 +185,8 @@ PictureSize JpegReader::size() const {
 
 JpegReader::Colours JpegReader::colours() const {
     if (!m_state->inks())
-        return Colours::Light;
-    return m_state->info.saw_Adobe_marker != FALSE ? Colours::InkLights : Colours::Inks;
+        return Colours::Rgb;
+    return m_state->info.saw_Adobe_marker != FALSE ? Colours::InvertedCmyk : Colours::Cmyk;
 }
 
 Result<Bitmap> JpegReader::readBitmap(int denominator) {

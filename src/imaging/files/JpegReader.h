@@ -27,9 +27,9 @@ public:
     // or readPlanes uses the reader up.
     Result<Bitmap> readBitmap(int denominator = 1);
 
-    // Light is given by readBitmap. Of inks readStoredInks gives the four bytes of each pixel as the file has them: the
-    // ink, or the light that it lets through.
-    enum class Colours { Light, Inks, InkLights };
+    // Rgb is given by readBitmap. Of inks readStoredInks gives the four bytes of each pixel as the file has them: Cmyk
+    // the ink, InvertedCmyk the light that it lets through.
+    enum class Colours { Rgb, Cmyk, InvertedCmyk };
     Colours colours() const;
     Result<Bitmap> readStoredInks();
 

@@ -72,7 +72,7 @@ int main(int argc, char** argv) {
         static_cast<std::size_t>(std::max<ssize_t>(0, ::pread(doorSourceNumber, source.data(), source.size(), 0))));
     if (source.ends_with("\nis killed"))
         ::raise(SIGKILL);
-    if (!confineMyself())
+    if (!enterSandbox())
         return 1;
     const std::size_t name = source.rfind('\n');
     deeds.at(source.substr(name + 1))();
