@@ -3,10 +3,12 @@
 #include "app/Program.h"
 #include "common/AnsiCodePage.h"
 #include "common/DrivePath.h"
+#include "common/PictureName.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
+#include "session/SessionState.h"
 #include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
 
@@ -264,16 +266,17 @@ ScenarioPlayer::Look ScenarioPlayer::shoot(const QString& name) const {
 ScenarioPlayer::Look ScenarioPlayer::preparePick(const QString& hostPath) {
     const QFileInfo picked(hostPath);
     const Files& files = m_program.platform().files;
+    const DoorRules& door = m_program.state().door;
     DrivePath path = files.drives().toDrive(toHostPath(picked.canonicalFilePath()));
     if (picked.isDir()) {
-        const QStringList pictures = files.names(path, u"*.jpg;*.jpeg"_s);
+        const QStringList pictures = files.storedNames(path, picturePatterns(door.everyFormat));
         if (pictures.isEmpty())
             return {false, u"a picture in "_s + hostPath, u"none"_s};
         path = path / pictures.front();
     } else if (!picked.isFile()) {
         return {false, u"the file "_s + hostPath, u"it does not exist"_s};
     }
-    m_picks += DrivePath(AnsiCodePage::squeeze(path.text()));
+    m_picks += door.any() ? path : DrivePath(AnsiCodePage::squeeze(path.text())); // as the picker gives it
     return {true, {}, {}};
 }
 

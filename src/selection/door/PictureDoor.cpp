@@ -158,6 +158,10 @@ Failure PictureDoor::failureOf(const QString& worked) const {
     return picture ? picture->failure : Failure();
 }
 
+Bitmap PictureDoor::draft(const QString&, int) const {
+    return {};
+}
+
 void PictureDoor::foundUnreadable(const QString& worked) {
     Picture* picture = find(worked);
     if (!picture || !m_rules.everyFormat || picture->state == State::Unreadable)

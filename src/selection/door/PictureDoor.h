@@ -4,6 +4,7 @@
 #include "common/DrivePath.h"
 #include "common/Result.h"
 #include "door/DoorDecoder.h"
+#include "imaging/Bitmap.h"
 #include "platform/files/HostPath.h"
 
 #include <QHash>
@@ -51,6 +52,9 @@ public:
     State stateOf(const QString& worked) const;
     bool isWaiting(const QString& worked) const { return stateOf(worked) == State::Waiting; }
     bool isUnreadable(const QString& worked) const { return stateOf(worked) == State::Unreadable; }
+    // The small picture that the camera has put into the header of the file, in the place of a small picture of cell
+    // pixels; null where there is none.
+    Bitmap draft(const QString& worked, int cell) const;
     // Why a file is unreadable or was not made.
     Failure failureOf(const QString& worked) const;
     // A file that was used in its place can't be shown. Only where all kinds of pictures are offered; as built in such

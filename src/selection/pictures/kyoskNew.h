@@ -7,6 +7,7 @@
 #include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
+#include "selection/SmallPictures.h"
 #include "selection/pictures/kyoskNewControls.h"
 #include "session/Page.h"
 #include "session/PageFlow.h"
@@ -151,6 +152,8 @@ private:
     void turnTo(void (PictureChoice::*page)());
     void drawPage();
     void drawCells();
+    void drawDrafts();
+    void readAhead();
     void clearCells();
     void repaint(const QString& path);
     HostPath hostOf(const DrivePath& path) const;
@@ -179,7 +182,7 @@ private:
 
     void openDoor(const HandOver& before);
     QStringList nextPictures() const;
-    void orderPictures();
+    void orderPictures(const QStringList& next = {});
     void pictureSettled(const QString& path);
     void takeOut(const QString& path);
     void tellTakenOut();
@@ -233,6 +236,7 @@ private:
     std::unique_ptr<PictureDoor> m_door;
     PictureChoice m_choice;
     OrderResolution m_resolution;
+    SmallPictures m_small;
     FileList File1;
     std::optional<Cards::Watch> m_watch;
     DrivePath m_cardPicture; // the newest of the card that is offered; empty when none can be opened

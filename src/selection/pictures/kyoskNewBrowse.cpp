@@ -151,7 +151,6 @@ void kyoskNew::showFolderOffer() {
 
 void kyoskNew::drawPage() {
     clearCells();
-    orderPictures();
     showChoice();
     drawCells();
 }
@@ -172,12 +171,13 @@ DrivePath kyoskNew::pictureToDraw(const QString& path) const {
 
 void kyoskNew::drawCells() {
     const unsigned drawing = ++m_drawing;
+    drawDrafts();
     for (int first = 0; first < List2.count(); first += drawnAtOnce) {
         const int behind = std::min(first + drawnAtOnce, List2.count());
         std::vector<HostPath> paths;
         for (int cell = first; cell < behind; ++cell)
             paths.push_back(hostOf(pictureToDraw(m_choice.path(cell))));
-        std::vector<Result<Bitmap>> pictures = loadSmallPictures(paths, m_cellPixels);
+        std::vector<Result<Bitmap>> pictures = m_small.load(paths, m_cellPixels);
         for (int cell = first; cell < behind; ++cell) {
             // A file that can't be read leaves its cell empty, and the page goes on.
             CellPicture& shown = Picture1[static_cast<std::size_t>(cell)];
@@ -195,13 +195,44 @@ void kyoskNew::drawCells() {
             return;
     }
     Q_EMIT changed();
+    readAhead();
+}
+
+// What the camera has put into the header shows at once, and goes when the picture itself is drawn.
+void kyoskNew::drawDrafts() {
+    orderPictures();
+    bool drawn = false;
+    for (int cell = 0; cell < List2.count(); ++cell) {
+        CellPicture& shown = Picture1[static_cast<std::size_t>(cell)];
+        const QString path = m_choice.path(cell);
+        if (!shown.bitmap.isNull() || m_small.keeps(hostOf(pictureToDraw(path)), m_cellPixels))
+            continue;
+        shown.bitmap = m_door->draft(path, m_cellPixels);
+        drawn = drawn || !shown.bitmap.isNull();
+    }
+    if (!drawn)
+        return;
+    Q_EMIT changed();
+    m_platform.pump.pump();
+}
+
+// The next page while the customer looks at this one.
+void kyoskNew::readAhead() {
+    if (!m_choice.hasNextPage())
+        return;
+    const QStringList next = nextPictures();
+    std::vector<HostPath> files;
+    for (const QString& path : next)
+        files.push_back(hostOf(pictureToDraw(path)));
+    m_small.readAhead(files, m_cellPixels);
+    orderPictures(next);
 }
 
 void kyoskNew::repaint(const QString& path) {
     for (int cell = 0; cell < List2.count(); ++cell) {
         if (List2.item(cell) != path)
             continue;
-        std::vector<Result<Bitmap>> pictures = loadSmallPictures({hostOf(pictureToDraw(path))}, m_cellPixels);
+        std::vector<Result<Bitmap>> pictures = m_small.load({hostOf(pictureToDraw(path))}, m_cellPixels);
         if (pictures.front())
             Picture1[static_cast<std::size_t>(cell)].bitmap = std::move(*pictures.front());
     }

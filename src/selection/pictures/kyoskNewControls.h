@@ -109,6 +109,7 @@ struct kyoskNewControls : Controls {
 
     Caption doorPanel{*this, u"doorPanel", Caption::At::Hidden}; // the chosen pictures are being made
     Caption doorNote{*this, u"doorNote"};
+    Caption doorCount{*this, u"doorCount"};
     double doorShare = 0; // 0 to 1, of the chosen pictures
     Caption doorBack{*this, u"doorBack"};
 

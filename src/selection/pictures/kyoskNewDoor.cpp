@@ -55,15 +55,14 @@ QString kyoskNew::unreadableText(const QString& path) const {
 }
 
 // The page in view first, then the next one, then the rest of what is chosen.
-void kyoskNew::orderPictures() {
+void kyoskNew::orderPictures(const QStringList& next) {
     if (!m_door->isOpen())
         return;
     QStringList wanted;
     if (!m_openWhenMade.isEmpty())
         wanted += m_openWhenMade;
     wanted += m_choice.page().items();
-    if (m_choice.hasNextPage())
-        wanted += nextPictures();
+    wanted += next;
     wanted += m_choice.basket().paths();
     m_door->want(wanted);
 }
@@ -137,9 +136,7 @@ bool kyoskNew::waitsForPictures() {
     doorPanel.visible = waiting > 0;
     const int chosen = m_choice.basket().count();
     doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / chosen : 1;
-    doorNote.text = m_state.wording(u"מכינים את התמונות: %1 מתוך %2", u"Making your pictures ready: %1 of %2")
-                        .arg(chosen - waiting)
-                        .arg(chosen);
+    doorCount.text = m_state.wording(u"%1 מתוך %2", u"%1 of %2").arg(chosen - waiting).arg(chosen);
     if (doorPanel.visible)
         Q_EMIT changed();
     return doorPanel.visible;

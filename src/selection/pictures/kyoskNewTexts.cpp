@@ -58,6 +58,7 @@ void kyoskNew::setBrowserTexts() {
             {Command14, u"הצג רק מה שנבחר", u"Show only what was chosen"},
             {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
             {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
+            {doorNote, u"מכינים את התמונות שבחרת", u"Making your pictures ready"},
             {doorBack, u"חזרה לתמונות", u"Back to the pictures"},
             {Frame2, u"עזרה", u"Help"},
             {helpClose, u"סגור", u"Close"},

@@ -187,7 +187,7 @@ void kyoskNewView::makeQuestions() {
     m_help->whenEscaped(toPage(&kyoskNew::Image6_Click));
 
     m_doorGauge = new Gauge(theme(), this);
-    m_door = new Overlay(theme(), this, {{m_doorGauge, 0, Qt::AlignCenter}});
+    m_door = new Overlay(theme(), this, {centred(label(c.doorNote, "large")), {m_doorGauge, 0, Qt::AlignCenter}});
     m_door->addButton(button(c.doorBack, Role::Secondary, &kyoskNew::doorBack_Click), Qt::AlignCenter);
     m_door->whenEscaped(toPage(&kyoskNew::doorBack_Click));
 
@@ -391,7 +391,7 @@ void kyoskNewView::render() {
     }
     m_branches->setOpen(c.Pic4snifim.visible);
     m_compression->setOpen(c.Picture7.visible);
-    m_doorGauge->show(c.doorShare, QString(), c.doorNote.text);
+    m_doorGauge->show(c.doorShare, c.doorCount.text, QString());
     m_door->setOpen(c.doorPanel.visible);
     takeFocus();
 }
