@@ -146,7 +146,7 @@ TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
     page.doorBack_Click();
     EXPECT_FALSE(page.controls().doorPanel.visible);
     page.Image7_Click();
-    EXPECT_TRUE(page.controls().doorCount.text.endsWith(u" of 19"_s));
+    EXPECT_TRUE(page.controls().doorCount.text.endsWith(u" / 19"_s));
     waitUntil([&page] { return page.controls().Frame4.visible; });
     EXPECT_FALSE(page.controls().doorPanel.visible);
     EXPECT_EQ(page.controls().Label20.text, u"17"_s);

@@ -136,7 +136,7 @@ bool kyoskNew::waitsForPictures() {
     doorPanel.visible = waiting > 0;
     const int chosen = m_choice.basket().count();
     doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / chosen : 1;
-    doorCount.text = m_state.wording(u"%1 מתוך %2", u"%1 of %2").arg(chosen - waiting).arg(chosen);
+    doorCount.text = u"%1 / %2"_s.arg(chosen - waiting).arg(chosen);
     if (doorPanel.visible)
         Q_EMIT changed();
     return doorPanel.visible;
