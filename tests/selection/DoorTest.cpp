@@ -154,6 +154,19 @@ TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
               QStringList(u"These pictures can't be read and were taken out of the order:\ne.png\nz13.png"_s));
 }
 
+TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
+    machine.platform.doorProgram = "/no/such/program"; // as a disk that is full
+    kyoskNew& page = openWithTheFolder();
+    page.Picture1_Click(3);
+    for (const int told : {1, 2, 3}) {
+        waitUntil([&] { return machine.dialogs.messages.size() == told && !page.controls().doorPanel.visible; });
+        page.Image7_Click();
+    }
+    EXPECT_TRUE(machine.dialogs.messages.last().startsWith(u"The picture d.heic could not be made ready:\n"_s));
+    EXPECT_EQ(page.controls().List1.count(), 1);
+    EXPECT_FALSE(page.controls().Frame4.visible);
+}
+
 TEST_F(TheDoor, OpensAPictureInTheEditorOnceItIsMade) {
     state.Optint = OrderKind::EditedPrint;
     kyoskNew& page = openWithTheFolder();

@@ -51,6 +51,7 @@ public:
 
     State stateOf(const QString& worked) const;
     bool isWaiting(const QString& worked) const { return stateOf(worked) == State::Waiting; }
+    bool isNotMade(const QString& worked) const { return stateOf(worked) == State::NotMade; }
     bool isUnreadable(const QString& worked) const { return stateOf(worked) == State::Unreadable; }
     // The small picture that the camera has put into the header of the file, in the place of a small picture of cell
     // pixels; null where there is none.

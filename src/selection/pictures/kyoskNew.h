@@ -186,9 +186,10 @@ private:
     void pictureSettled(const QString& path);
     void takeOut(const QString& path);
     void tellTakenOut();
-    int waitingPictures() const;
-    bool waitsForPictures();
+    QStringList chosenThat(bool (PictureDoor::*is)(const QString&) const) const;
+    void finishOnceMade();
     void showWaiting();
+    void tellNotMade(const QString& path);
     void stopWaiting();
     QString unreadableText(const QString& path) const;
     DrivePath shownPath(const QString& path) const;
@@ -200,6 +201,7 @@ private:
     int putRecord();
 
     void finish();
+    void openFinish();
     void finishAlbum();
     void checkAndClose();
     bool couponRefuses();

@@ -22,6 +22,8 @@ void kyoskNew::choosePicture(int cell) {
         return orderPictures();
     if (plain()) {
         m_choice.choose(cell, {});
+        if (m_door->isWaiting(path))
+            Picture2.bitmap = Bitmap();
         showLarge(DrivePath(path));
     } else {
         leaveEditor();

@@ -8,6 +8,7 @@
 #include "session/SessionState.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace lumora {
 
@@ -79,13 +80,13 @@ QStringList kyoskNew::nextPictures() const {
 void kyoskNew::pictureSettled(const QString& path) {
     if (m_handedOver)
         return;
-    if (m_door->stateOf(path) == PictureDoor::State::NotMade) {
-        if (!std::exchange(m_notMadeTold, true))
-            m_platform.dialogs.message(m_door->failureOf(path).message);
+    if (m_door->isNotMade(path)) {
+        if (!doorPanel.visible && !std::exchange(m_notMadeTold, true))
+            tellNotMade(path);
     } else if (m_door->isUnreadable(path) && m_choice.inBasket(path)) {
         takeOut(path);
     }
-    if (waitingPictures() == 0)
+    if (chosenThat(&PictureDoor::isWaiting).isEmpty())
         tellTakenOut();
     m_resolution.look(path);
     repaint(path);
@@ -97,8 +98,8 @@ void kyoskNew::pictureSettled(const QString& path) {
         choosePicture(List2.find(path));
     else if (plain() && m_largePath.text() == path)
         showLarge(m_largePath);
-    if (doorPanel.visible && !waitsForPictures())
-        finish();
+    if (doorPanel.visible)
+        showWaiting();
     Q_EMIT changed();
 }
 
@@ -119,27 +120,37 @@ void kyoskNew::tellTakenOut() {
     m_platform.dialogs.message(told.arg(names.join(u'\n')));
 }
 
-// Of the chosen pictures.
-int kyoskNew::waitingPictures() const {
-    const QStringList chosen = m_choice.basket().paths();
-    return static_cast<int>(
-        std::count_if(chosen.begin(), chosen.end(), [this](const QString& path) { return m_door->isWaiting(path); }));
+QStringList kyoskNew::chosenThat(bool (PictureDoor::*is)(const QString&) const) const {
+    QStringList chosen = m_choice.basket().paths();
+    chosen.removeIf([&](const QString& path) { return !(*m_door.*is)(path); });
+    return chosen;
 }
 
-// The order goes on once the last chosen picture is made.
-bool kyoskNew::waitsForPictures() {
-    if (!m_door->isOpen())
-        return false;
-    if (!doorPanel.visible)
-        orderPictures();
-    const int waiting = waitingPictures();
+// The order goes on once the last chosen picture is made; what a full disk did not take is tried once more.
+void kyoskNew::finishOnceMade() {
+    orderPictures();
+    showWaiting();
+}
+
+void kyoskNew::showWaiting() {
+    const qsizetype chosen = m_choice.basket().count();
+    const qsizetype waiting = chosenThat(&PictureDoor::isWaiting).size();
+    const QStringList notMade = chosenThat(&PictureDoor::isNotMade);
     doorPanel.visible = waiting > 0;
-    const int chosen = m_choice.basket().count();
-    doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / chosen : 1;
+    doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / static_cast<double>(chosen) : 1;
     doorCount.text = u"%1 / %2"_s.arg(chosen - waiting).arg(chosen);
-    if (doorPanel.visible)
+    if (waiting > 0)
         Q_EMIT changed();
-    return doorPanel.visible;
+    else if (notMade.isEmpty())
+        openFinish();
+    else
+        tellNotMade(notMade.first());
+}
+
+void kyoskNew::tellNotMade(const QString& path) {
+    m_platform.dialogs.message(
+        m_state.wording(u"התמונה %1 לא הוכנה להזמנה:\n%2", u"The picture %1 could not be made ready:\n%2")
+            .arg(shownPath(path).leaf(), m_door->failureOf(path).message));
 }
 
 void kyoskNew::stopWaiting() {

@@ -23,8 +23,10 @@ const QString notTyped = u"לא הוקלד"_s; // the mail address of a customer
 } // namespace
 
 void kyoskNew::finish() {
-    if (waitsForPictures())
-        return;
+    finishOnceMade();
+}
+
+void kyoskNew::openFinish() {
     openBranches();
     checkAndClose();
 }
