@@ -10,7 +10,7 @@ namespace lumora {
 
 namespace {
 
-constexpr qint64 headSize = 65536;
+constexpr qint64 headSize = 16384;
 constexpr int maxParts = 2000;        // segments or chunks that are looked at
 constexpr int maxDataParts = 100'000; // chunks of pixels that are passed over; large pictures have some ten thousand
 constexpr qint64 maxProfile = 4 << 20;

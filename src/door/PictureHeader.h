@@ -10,7 +10,7 @@
 #include <optional>
 
 // What the header of a picture file says, read by code of our own from any bytes whatever: it reads nothing outside of
-// them, takes a bounded number of steps, and leaves out what it does not find. The first 64 KB are asked for once.
+// them, takes a bounded number of steps, and leaves out what it does not find. The first 16 KB are asked for once.
 namespace lumora {
 
 inline constexpr qint64 maxDoorPixels = 100'000'000;

@@ -1,5 +1,6 @@
 #include "door/UprightJpeg.h"
 
+#include "door/Orientation.h"
 #include "imaging/Bitmap.h"
 #include "imaging/drawing/Drawing.h"
 #include "imaging/scaling/Resample.h"
@@ -108,18 +109,6 @@ QByteArray withThumbnail(QByteArray jpeg, const Bitmap& picture) {
     // Behind the segment that the encoder begins with.
     const qsizetype at = 4 + qFromBigEndian<quint16>(jpeg.constData() + 4);
     return segment.size() <= largestSegment ? jpeg.insert(at, segment) : jpeg;
-}
-
-Bitmap upright(Bitmap picture, int orientation) {
-    if (orientation == 2 || orientation == 7)
-        picture = Bitmap(std::move(picture.image()).mirrored(true, false));
-    else if (orientation == 4 || orientation == 5)
-        picture = Bitmap(std::move(picture.image()).mirrored(false, true));
-    if (orientation == 3)
-        return turned(picture, QuarterTurn::Half);
-    if (orientation >= 5)
-        return turned(picture, orientation == 8 ? QuarterTurn::Left : QuarterTurn::Right);
-    return picture;
 }
 
 // The picture in sRGB; null when memory is short.

@@ -4,6 +4,7 @@
 #include "order/DoorFolders.h"
 #include "order/OrderFolder.h"
 #include "order/OrderState.h"
+#include "samples/SamplePhotographs.h"
 #include "samples/SamplePictureFiles.h"
 #include "selection/door/DoorNames.h"
 #include "selection/pictures/kyoskNew.h"
@@ -11,6 +12,7 @@
 #include "support/PageRig.h"
 
 #include <QElapsedTimer>
+#include <QFile>
 #include <QGuiApplication>
 
 #include <gtest/gtest.h>
@@ -165,6 +167,41 @@ TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
     EXPECT_TRUE(machine.dialogs.messages.last().startsWith(u"The picture d.heic could not be made ready:\n"_s));
     EXPECT_EQ(page.controls().List1.count(), 1);
     EXPECT_FALSE(page.controls().Frame4.visible);
+}
+
+qint64 bytesRead() {
+    QFile counts(u"/proc/self/io"_s);
+    EXPECT_TRUE(counts.open(QIODevice::ReadOnly));
+    return counts.readLine().mid(7).trimmed().toLongLong(); // "rchar: 123"
+}
+
+TEST_F(TheDoor, ShowsWhatTheHeadersHoldAtOnceAndThenThePicturesThemselves) {
+    makeFolder(u"C:\\q"_path);
+    QImage old(160, 120, QImage::Format_RGB32); // of another picture, which a program has left there
+    old.fill(Qt::red);
+    const QByteArray photograph = samplePhotographFile({1500, 1000}, 1);
+    ASSERT_GT(photograph.size() * 12, 3'000'000);
+    for (int i = 0; i < 30; ++i)
+        write(u"C:\\q"_path / u"%1.jpg"_s.arg(10 + i), jpegWith(photograph, exif(1, false, saved(old, "JPG"))));
+    chain.show(PageId::kyoskNew);
+    auto& page = *chain.find<kyoskNew>();
+    const auto& cells = page.controls().Picture1;
+    const auto isDraft = [&](std::size_t cell) {
+        const QImage& drawn = cells[cell].bitmap.image();
+        return !drawn.isNull() && drawn.pixelColor(drawn.rect().center()).red() > 240 && drawn.size() == QSize(115, 77);
+    };
+    const qint64 before = bytesRead();
+    qint64 firstSight = 0;
+    QObject::connect(&page, &Page::changed, [&] {
+        if (firstSight == 0 && isDraft(0) && isDraft(11))
+            firstSight = bytesRead() - before;
+    });
+    machine.dialogs.picks += u"C:\\q\\10.jpg"_path;
+    page.Image5_Click();
+    EXPECT_GT(firstSight, 12 * 1000);
+    EXPECT_LT(firstSight, 1'000'000);
+    for (std::size_t cell = 0; cell < cells.size(); ++cell)
+        EXPECT_FALSE(isDraft(cell)) << cell;
 }
 
 TEST_F(TheDoor, OpensAPictureInTheEditorOnceItIsMade) {

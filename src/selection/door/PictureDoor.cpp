@@ -3,6 +3,7 @@
 #include "common/AnsiCodePage.h"
 #include "common/FixedText.h"
 #include "common/PictureName.h"
+#include "door/PictureDraft.h"
 #include "platform/files/Files.h"
 #include "selection/door/DoorNames.h"
 
@@ -158,8 +159,10 @@ Failure PictureDoor::failureOf(const QString& worked) const {
     return picture ? picture->failure : Failure();
 }
 
-Bitmap PictureDoor::draft(const QString&, int) const {
-    return {};
+Bitmap PictureDoor::draft(const QString& worked, int cell) const {
+    const Picture* picture = find(worked);
+    const HostPath source = picture ? picture->source : m_files.drives().toHost(DrivePath(worked)).value_or(HostPath());
+    return pictureDraft(source, cell, m_rules.upright ? Held::Upright : Held::AsStored);
 }
 
 void PictureDoor::foundUnreadable(const QString& worked) {
