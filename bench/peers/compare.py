@@ -47,6 +47,7 @@ def main():
         paper_box = "1800x1350"
         vips_paper = [vips, "--size", paper_box, "--no-rotate", "-o", out + "/%s.jpg[Q=90,subsample-mode=on]"] + files if vips else None
         vips_small = [vips, "--size", "115x115", "--no-rotate", "-o", out + "/%s.jpg[Q=75,subsample-mode=on]"] + files if vips else None
+        qt_small = [os.path.join(programs, "peer_qt"), "small", "115", out] + files
         magick_paper = [magick] + files + ["-resize", paper_box, "-sampling-factor", "4:2:0", "-quality", "90",
                                            out + "/%02d.jpg"] if magick else None
         one, two = {"VIPS_CONCURRENCY": "1"}, {"VIPS_CONCURRENCY": "2"}
@@ -58,6 +59,9 @@ def main():
             ("paper: zimg on the same planes", own("peer_zimg"), None, ours("paper"), ">= 0.95"),
             ("small pictures: vipsthumbnail, 1 thread", vips_small, one, ours("small", "1"), ""),
             ("small pictures: vipsthumbnail / ours on 2 threads, elapsed", vips_small, one, ours("small", "2"), ">= 2.2"),
+            ("small pictures: Qt's reader, 1 thread", qt_small, None, ours("small", "1"), ""),
+            ("drafts: vipsthumbnail, 1 thread", vips_small, one, ours("drafts"), ""),
+            ("drafts: Qt's reader", qt_small, None, ours("drafts"), ""),
         ]
         print(HEADING)
         for line in lines:

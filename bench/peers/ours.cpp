@@ -1,9 +1,9 @@
-// ours paper KERNELS FOLDER FILE... | ours floor - FOLDER FILE... | ours small THREADS FOLDER FILE... | ours idle - - -
-// ours planes - FOLDER FILE... makes what floor reads.
-// KERNELS is "best" or a name of allKernels. "floor" decodes to planes and encodes planes of the print's size, no
-// scaling between.
+// ours paper KERNELS FOLDER FILE... | ours floor - FOLDER FILE... | ours small THREADS FOLDER FILE... | ours drafts -
+// FOLDER FILE... ours idle - - - ours planes - FOLDER FILE... makes what floor reads. KERNELS is "best" or a name of
+// allKernels. "floor" decodes to planes and encodes planes of the print's size, no scaling between.
 
 #include "Floor.h"
+#include "door/PictureDraft.h"
 #include "imaging/scaling/Resample.h"
 
 #include <cmath>
@@ -58,6 +58,8 @@ int main(int argc, char** argv) {
         }
     }
     for (int i = 4; i < argc; ++i) {
+        if (mode == "drafts")
+            writeBytes(target(folder, argv[i]), *encodeJpeg(pictureDraft(argv[i], 115, Held::Upright), 75));
         if (mode == "paper") {
             auto reader = readerOf(argv[i]);
             const auto bytes = readResampledToJpeg(*reader, paperSize(reader->size()), 90, kernelsNamed(argv[2]));
