@@ -36,9 +36,6 @@ public:
     using Objects = QMap<QDBusObjectPath, UdisksMedia::Interfaces>;
 
     DiskService() {
-        qDBusRegisterMetaType<UdisksMedia::Interfaces>();
-        qDBusRegisterMetaType<Objects>();
-        qDBusRegisterMetaType<QList<QByteArray>>();
         m_daemon.start(u"dbus-daemon"_s, {u"--session"_s, u"--nofork"_s, u"--nopidfile"_s, u"--print-address=1"_s,
                                           u"--address=unix:dir="_s + m_folder.path()});
         EXPECT_TRUE(m_daemon.waitForStarted() && m_daemon.waitForReadyRead()) << "needs the package dbus-daemon";
@@ -86,12 +83,14 @@ public:
         mountings += name + u' ' + options.value(u"options"_s).toString();
         if (name == u"refused")
             return bus.send(message.createErrorReply(u"org.freedesktop.UDisks2.Error.NotAuthorized"_s, u"no right"_s));
-        const QVariantMap changed{
-            {u"MountPoints"_s, QVariant::fromValue(QList<QByteArray>{"/media/" + name.toUtf8() + '\0'})}};
-        objects[QDBusObjectPath(message.path())][fileSystem] = changed;
-        send(message.path(), u"org.freedesktop.DBus.Properties"_s, u"PropertiesChanged"_s,
-             {fileSystem, changed, QStringList()});
+        setMounted(name, {"/media/" + name.toUtf8() + '\0'});
         return bus.send(message.createReply(u"/media/"_s + name));
+    }
+    void setMounted(const QString& name, const QList<QByteArray>& points) {
+        const QDBusObjectPath block(root + u"/block_devices/"_s + name);
+        objects[block][fileSystem] = {{u"MountPoints"_s, QVariant::fromValue(points)}};
+        send(block.path(), u"org.freedesktop.DBus.Properties"_s, u"PropertiesChanged"_s,
+             {fileSystem, objects[block][fileSystem], QStringList()});
     }
 
     QString address;
@@ -115,16 +114,16 @@ private:
 
 TEST(UdisksMedia, AreTheCustomersAloneAndMountedForReading) {
     DiskService disks;
+    QStringList warnings;
+    UdisksMedia media(disks.address, [&](const QString& text) { warnings += text; });
     disks.enter();
     const QVariantMap usb{{u"ConnectionBus"_s, u"usb"_s}};
     disks.put(u"card"_s, {{u"Removable"_s, true}, {u"Media"_s, u"flash_sd"_s}}, u"EOS"_s, QList<QByteArray>());
     disks.put(u"stick"_s, usb, u"HOME"_s, QList<QByteArray>{QByteArray("/media/dana/HOME\0", 17)});
     disks.put(u"disk"_s, {{u"Removable"_s, false}, {u"ConnectionBus"_s, QString()}}, {}, QList<QByteArray>());
-    disks.put(u"kiosk"_s, usb, {}, QList<QByteArray>{QByteArray("/\0", 2)});
+    disks.put(u"kiosk"_s, usb, {}, QList<QByteArray>{QByteArray("/boot/efi\0", 10)});
     disks.put(u"whole"_s, usb, {}, std::nullopt);
     disks.put(u"refused"_s, usb, {}, QList<QByteArray>());
-    QStringList warnings;
-    UdisksMedia media(disks.address, [&](const QString& text) { warnings += text; });
     QString now = u"nothing"_s;
     bool absent = false;
     QObject::connect(&media, &RemovableMedia::found, &media, [&](const auto& found) { now = told(found); });
@@ -140,9 +139,11 @@ TEST(UdisksMedia, AreTheCustomersAloneAndMountedForReading) {
     disks.takeOut(u"card"_s);
     EXPECT_TRUE(QTest::qWaitFor([&] { return now == u"1 NIKON /media/later, 3 HOME /media/dana/HOME"; }, 20000))
         << qPrintable(now);
+    disks.setMounted(u"stick"_s, {});
     disks.put(u"card"_s, {{u"Removable"_s, true}}, u"OTHER"_s, QList<QByteArray>());
-    EXPECT_TRUE(QTest::qWaitFor([&] { return now.startsWith(u"0 OTHER /media/card"); }, 20000))
+    EXPECT_TRUE(QTest::qWaitFor([&] { return now == u"0 OTHER /media/card, 1 NIKON /media/later"; }, 20000))
         << "put in again: " << qPrintable(now);
+    EXPECT_EQ(disks.mountings.join(u' '), u"card ro refused ro later ro card ro") << "the stick is to be taken out";
     EXPECT_FALSE(absent);
     DiskService::leave();
     EXPECT_TRUE(QTest::qWaitFor([&] { return absent; }, 20000)) << "the service has ended";

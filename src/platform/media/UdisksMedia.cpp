@@ -40,6 +40,11 @@ QList<QByteArray> mountPoints(const QVariant& value) {
     return points;
 }
 
+bool isOfTheSystem(const QByteArray& mountPoint) {
+    return mountPoint == "/" || mountPoint.startsWith("/boot") || mountPoint.startsWith("/efi") ||
+           mountPoint.startsWith("/home");
+}
+
 Medium::Kind kindOf(const QString& media, const QString& bus) {
     if (media.startsWith(u"flash_sd"))
         return Medium::Kind::SdCard;
@@ -150,12 +155,14 @@ bool UdisksMedia::isCustomers(const QString& block) const {
     const QString bus = property(drive, driveInterface, "ConnectionBus").toString();
     if (!property(drive, driveInterface, "Removable").toBool() && bus != u"usb" && bus != u"sdio")
         return false;
-    if (property(block, blockInterface, "HintIgnore").toBool())
+    if (property(block, blockInterface, "HintIgnore").toBool() ||
+        property(block, blockInterface, "HintSystem").toBool())
         return false;
-    // A kiosk may run from a stick of its own.
+    // A kiosk may run from a stick or a card of its own.
     for (auto at = m_objects.begin(); at != m_objects.end(); ++at) {
+        const QList<QByteArray> points = mountPoints(property(at.key(), fileSystemInterface, "MountPoints"));
         if (property(at.key(), blockInterface, "Drive").value<QDBusObjectPath>().path() == drive &&
-            mountPoints(property(at.key(), fileSystemInterface, "MountPoints")).contains("/"))
+            std::any_of(points.begin(), points.end(), isOfTheSystem))
             return false;
     }
     return true;
@@ -174,6 +181,9 @@ void UdisksMedia::look() {
             mount(block);
             continue;
         }
+        // Whoever unmounts it later wants to take it out.
+        if (!m_asked.contains(block))
+            m_asked += block;
         const QString drive = property(block, blockInterface, "Drive").value<QDBusObjectPath>().path();
         media.push_back({block + u' ' + property(block, blockInterface, "IdUUID").toString(),
                          kindOf(property(drive, driveInterface, "Media").toString(),

@@ -43,7 +43,7 @@ private:
     QString m_connectionName;
     QDBusConnection m_bus;
     QMap<QString, Interfaces> m_objects;
-    QStringList m_asked; // blocks that were asked to be mounted: once each while they are in
+    QStringList m_asked; // blocks that were mounted or asked to be: once each while they are in
     bool m_begun = false;
 };
 

@@ -59,9 +59,6 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     frame().content()->addLayout(makeTopRow());
     auto* body = new QWidget(this);
     m_body = new QStackedLayout(body);
-    m_card = new CardOffer(theme, this);
-    bind(m_card, c.cardOffer);
-    connect(m_card, &QAbstractButton::clicked, &page, &kyoskNew::cardOffer_Click);
     m_body->addWidget(makeEmpty());
     QWidget* grid = makeGrid();
     m_side = makeSide();
@@ -135,6 +132,9 @@ QWidget* kyoskNewView::makeEmpty() {
 }
 
 QWidget* kyoskNewView::makeSide() {
+    m_card = new CardOffer(theme(), this);
+    bind(m_card, c.cardOffer);
+    connect(m_card, &QAbstractButton::clicked, &m_page, &kyoskNew::cardOffer_Click);
     m_large = new LargePicture(theme(), this);
     bindName(m_large, c.Picture2);
     connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
