@@ -3,6 +3,7 @@
 #include "common/HostFile.h"
 #include "door/DoorChild.h"
 #include "door/DoorStatus.h"
+#include "door/HeaderOfFile.h"
 #include "imaging/files/PictureInput.h"
 
 #include <algorithm>
@@ -42,34 +43,6 @@ Failure tooLarge(const std::filesystem::path& source) {
 
 Failure notRead(const std::filesystem::path& source, int error) {
     return fileFailure(source, u"can't be read"_s, error);
-}
-
-// The bytes from a place on, fewer at the end of the file or at an error, which is kept.
-QByteArray readPart(const Descriptor& file, qint64 at, qint64 count, int& error) {
-    QByteArray bytes(count, Qt::Uninitialized);
-    qint64 filled = 0;
-    while (filled < count) {
-        const ssize_t got =
-            ::pread(file.number(), bytes.data() + filled, static_cast<std::size_t>(count - filled), at + filled);
-        if (got < 0 && errno == EINTR)
-            continue;
-        if (got < 0)
-            error = errno;
-        if (got <= 0)
-            break;
-        filled += got;
-    }
-    bytes.truncate(filled);
-    return bytes;
-}
-
-Result<PictureHeader> headerOf(const Descriptor& file, const std::filesystem::path& source) {
-    int error = 0;
-    PictureHeader header =
-        readPictureHeader(PictureBytes([&](qint64 at, qint64 count) { return readPart(file, at, count, error); }));
-    if (error != 0)
-        return notRead(source, error);
-    return header;
 }
 
 Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source,

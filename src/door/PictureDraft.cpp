@@ -1,12 +1,10 @@
 #include "door/PictureDraft.h"
 
-#include "common/HostFile.h"
+#include "door/HeaderOfFile.h"
 #include "door/Orientation.h"
-#include "door/PictureHeader.h"
 #include "imaging/files/PictureFile.h"
 
 #include <QBuffer>
-#include <QFile>
 #include <QImageReader>
 
 namespace lumora {
@@ -36,23 +34,19 @@ QImage withoutBars(const QImage& small, PictureSize picture) {
 } // namespace
 
 Bitmap pictureDraft(const std::filesystem::path& path, int cell, Held held) {
-    const auto source = openSource(path, {});
-    QFile file;
-    if (!source || !file.open(source->number(), QIODevice::ReadOnly | QIODevice::Unbuffered))
+    const auto file = openSource(path, {});
+    const auto header = file ? headerOf(*file, path) : file.failure();
+    if (!header || header->thumbnail.length == 0 || header->size.width < 1 || header->size.height < 1)
         return {};
-    const PictureBytes bytes(
-        [&file](qint64 at, qint64 count) { return file.seek(at) ? file.read(count) : QByteArray(); });
-    const PictureHeader header = readPictureHeader(bytes);
-    if (header.thumbnail.length == 0 || header.size.width < 1 || header.size.height < 1)
-        return {};
-    const QImage small = smallPicture(bytes.part(header.thumbnail.at, header.thumbnail.length));
+    int error = 0;
+    const QImage small = smallPicture(readPart(*file, header->thumbnail.at, header->thumbnail.length, error));
     if (small.isNull())
         return {};
-    const PictureSize size = smallPictureSize(header.size, cell);
-    Bitmap draft(withoutBars(small, header.size)
+    const PictureSize size = smallPictureSize(header->size, cell);
+    Bitmap draft(withoutBars(small, header->size)
                      .scaled(size.width, size.height, Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
                      .convertToFormat(QImage::Format_RGB32));
-    return held == Held::Upright ? upright(std::move(draft), header.orientation) : draft;
+    return held == Held::Upright ? upright(std::move(draft), header->orientation) : draft;
 }
 
 } // namespace lumora

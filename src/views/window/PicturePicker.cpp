@@ -2,11 +2,11 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/PictureName.h"
-#include "imaging/files/PictureFile.h"
 #include "platform/Machine.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
 #include "selection/CardWords.h"
+#include "selection/door/FolderPicture.h"
 #include "session/SessionState.h"
 #include "views/kit/CardOffer.h"
 #include "views/kit/ElidedLabel.h"
@@ -420,7 +420,7 @@ void PicturePicker::addPicture(const HostPath& path, bool isFolder) {
     item->setData(FolderRole, isFolder);
     item->setToolTip(nameOf(path));
     item->setData(PlainRole, !isFolder && !isPicture(path));
-    if (!isFolder && isJpeg(path))
+    if (!isFolder && isPicture(path))
         m_unread.push_back(m_grid->row(item));
 }
 
@@ -466,15 +466,11 @@ void PicturePicker::readNext() {
     QListWidgetItem* item = m_grid->item(*next);
     m_unread.erase(next);
     const HostPath path(item->data(PathRole).toByteArray().toStdString());
-    const int side = m_theme.size(Extent::Field);
-    if (const auto size = readPictureSize(path)) {
-        const QSize fit = QSize(size->width, size->height).scaled(side, side, Qt::KeepAspectRatio).expandedTo({1, 1});
-        if (const auto picture = loadPictureScaled(path, {fit.width(), fit.height()})) {
-            item->setData(PictureRole, picture->image());
-            return;
-        }
-    }
-    item->setData(BrokenRole, true);
+    const Bitmap picture = folderPicture(path, m_theme.size(Extent::Field), m_state.door);
+    if (!picture.isNull())
+        item->setData(PictureRole, picture.image());
+    else if (isJpeg(path))
+        item->setData(BrokenRole, true); // of another kind only the door knows
 }
 
 void PicturePicker::activate(const QListWidgetItem* item) {
