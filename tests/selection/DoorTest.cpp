@@ -164,7 +164,7 @@ TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
         waitUntil([&] { return machine.dialogs.messages.size() == told && !page.controls().doorPanel.visible; });
         page.Image7_Click();
     }
-    EXPECT_TRUE(machine.dialogs.messages.last().startsWith(u"The picture d.heic could not be made ready:\n"_s));
+    EXPECT_TRUE(machine.dialogs.messages.last().startsWith(u"The picture d.heic could not be made ready.\n"_s));
     EXPECT_EQ(page.controls().List1.count(), 1);
     EXPECT_FALSE(page.controls().Frame4.visible);
 }

@@ -148,9 +148,14 @@ void kyoskNew::showWaiting() {
 }
 
 void kyoskNew::tellNotMade(const QString& path) {
+    const Failure why = m_door->failureOf(path);
+    const QString reason =
+        why.kind == Failure::Kind::NoSpace ? m_state.wording(u"הדיסק מלא", u"The disk is full") : why.message;
     m_platform.dialogs.message(
-        m_state.wording(u"התמונה %1 לא הוכנה להזמנה:\n%2", u"The picture %1 could not be made ready:\n%2")
-            .arg(shownPath(path).leaf(), m_door->failureOf(path).message));
+        m_state
+            .wording(u"התמונה %1 לא הוכנה להזמנה.\nמה שכבר הוכן נשמר. נא לפנות לצוות.\n%2",
+                     u"The picture %1 could not be made ready.\nWhat is ready stays. Please ask the staff.\n%2")
+            .arg(shownPath(path).leaf(), reason));
 }
 
 void kyoskNew::stopWaiting() {
