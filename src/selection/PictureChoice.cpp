@@ -75,7 +75,15 @@ void PictureChoice::readChosenPage() {
 
 void PictureChoice::showAlone(const QStringList& paths) {
     m_seen.stay();
-    turnTo(paths.first(std::min<qsizetype>(paths.size(), cellsOfPage)));
+    if (std::ranges::all_of(paths, [this](const QString& path) { return m_shownAlone.contains(path); }))
+        m_shownAlone.clear();
+    QStringList next = paths;
+    if (paths.size() > cellsOfPage) {
+        next.removeIf([this](const QString& path) { return m_shownAlone.contains(path); });
+        next.resize(std::min<qsizetype>(next.size(), cellsOfPage));
+    }
+    m_shownAlone += next;
+    turnTo(next);
 }
 
 void PictureChoice::markPage() {
@@ -97,6 +105,7 @@ void PictureChoice::clear() {
     m_folders.clear();
     m_basket.clear();
     m_seen.clear();
+    m_shownAlone.clear();
     turnTo({});
 }
 

@@ -48,7 +48,8 @@ public:
     void previousPage();
     // A page of the basket's own pictures, from its reading position on.
     void chosenPage();
-    // A page of these pictures, or the first twelve of them; the page before it is the one in view.
+    // A page of these pictures; the page before it is the one in view. Of more than twelve each call shows the next
+    // ones that were not shown so, and behind the last it begins again.
     void showAlone(const QStringList& paths);
     // The copies of the cells are read from the basket again.
     void markPage();
@@ -83,6 +84,7 @@ private:
     FolderPager m_folders;
     SeenPages m_seen;
     TextList m_page;
+    QStringList m_shownAlone; // paths, in this round
     std::array<int, cellsOfPage> m_copies{};
     QChar m_paper = u' '; // the letter of the line before, for a paper word that is not known
 };

@@ -15,7 +15,9 @@ void SeenPages::seen(Page page) {
 }
 
 void SeenPages::stay() {
-    if (m_state.Careful && !m_pages.empty())
+    const std::size_t count = m_pages.size();
+    const bool stays = count > 1 && m_pages[count - 1] == m_pages[count - 2];
+    if (m_state.Careful && count > 0 && !stays)
         m_pages.push_back(m_pages.back());
 }
 

@@ -20,11 +20,12 @@ public:
     struct Page {
         Of of;
         int start; // index of its first picture, among those of the folders or the basket's lines
+        bool operator==(const Page&) const = default;
     };
 
     void clear() { m_pages.clear(); }
     void seen(Page page);
-    // A page that is not remembered comes over the one in view.
+    // A page that is not remembered comes over the one in view, or takes the place of one that is not remembered.
     void stay();
     // The page that was seen before the one in view; the first stays. No value as built in.
     std::optional<Page> goBack(int lines);

@@ -218,6 +218,27 @@ TEST_F(ThePictures, thatWillPrintCoarseAreToldOfAndShownBeforeTheyAreSent) {
     EXPECT_TRUE(shown.Frame4.visible && !shown.coarseNote.visible);
 }
 
+TEST_F(ThePictures, thatWillPrintCoarseAreShownTwelveAtATimeAndBeginAgain) {
+    state.Careful = true;
+    kyoskNew& page = openWith(14);
+    ASSERT_TRUE(saveJpeg(Bitmap(30, 40, Qt::red), host(u"C:\\p\\13.jpg"_path), 80)); // upright
+    const kyoskNewControls& shown = page.controls();
+    page.Command24_Click();
+    page.Image16_Click();
+    for (const auto& [cells, path] : {std::pair(12, first), {2, u"C:\\p\\13.jpg"_s}, {12, first}}) {
+        page.Image7_Click();
+        page.showCoarse_Click();
+        EXPECT_EQ(shown.List2.count(), cells);
+        EXPECT_EQ(shown.List2.item(0), path);
+        EXPECT_EQ(shown.Label2.text, path) << "in hand";
+        EXPECT_EQ(shown.Picture2.bitmap.height() > shown.Picture2.bitmap.width(), cells == 2);
+    }
+    for (const int cells : {2, 12}) {
+        page.Image15_Click();
+        EXPECT_EQ(shown.List2.count(), cells) << "back over all of them";
+    }
+}
+
 TEST_F(ThePictures, ofAnAlbumHaveAFinishOfTheirOwnUntilTheWholeFolderIsTaken) {
     state.Optint = OrderKind::Album;
     state.shemot.ppr = u"30/60"_s;

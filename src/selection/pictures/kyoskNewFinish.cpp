@@ -103,14 +103,16 @@ void kyoskNew::countCoarse() {
 
 void kyoskNew::showCoarsePictures() {
     closeFinish();
-    turnPage([this] {
+    QString first;
+    turnPage([&] {
         m_choice.showAlone(m_coarse);
+        first = m_choice.path(0);
         drawPage();
     });
-    if (!plain() || m_coarse.isEmpty())
+    if (!plain() || first.isEmpty())
         return;
-    showLarge(DrivePath(m_coarse.first()));
-    takeInHand(m_coarse.first());
+    showLarge(DrivePath(first));
+    takeInHand(first);
     Q_EMIT changed();
 }
 
