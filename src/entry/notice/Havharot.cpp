@@ -33,16 +33,19 @@ void Havharot::setTexts() {
                          u"הזמנה שלא נשלחה נשארת במחשב זה עד שתישלח.\n"
                          u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.\n"
                          u"משלוח בדואר יוצא דרך שרת הדואר של המעבדה. אין צורך בתוכנת דואר במחשב זה.\n"
-                         u"ניקיון ההיסטוריה מוחק את קבצי ההדפסה של הזמנות קודמות. לאחר מכן לא ניתן לשלוח אותן שוב.\n"
+                         u"ניקיון ההיסטוריה מוחק את קבצי ההדפסה של הזמנות קודמות%1. לאחר מכן לא ניתן לשלוח אותן שוב.\n"
                          u"דפי ההזמנה, רישומי ההזמנות והתמונות שלכם אינם נמחקים.",
                          u"Your pictures are only read and never changed.\n"
                          u"An order that was not sent stays on this computer until it is.\n"
                          u"Do not pull out a memory card while an order is being prepared.\n"
                          u"Mail goes by the lab's own mail server. It needs no mail program on this computer.\n"
-                         u"Cleaning the history deletes the print files of earlier orders. They can't be sent "
+                         u"Cleaning the history deletes the print files of earlier orders%1. They can't be sent "
                          u"again after that.\nOrder sheets, order logs and your own pictures stay."},
                         {Command1, u"המשך", u"Go on"},
                     });
+    // The clean-up then keeps the others.
+    const QString arrived = m_state.wording(u" שהגיעו", u" that have arrived");
+    Label1.text.replace(u"%1"_s, m_state.Careful ? arrived : QString());
     setCaptions(m_state, {
                              {Command2, u"יציאה", u"Exit"},
                              {Command3, u"בדוק תוכנת דואר", u"Check the mail program"},
