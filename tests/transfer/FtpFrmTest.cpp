@@ -29,9 +29,9 @@ class FtpFrmTest : public ::testing::Test, protected Line {};
 } // namespace
 
 TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
-    enum class Way { On, Back, Resend };
+    enum class Way { On, Back, Resend, ByHand };
     for (const auto& [careful, way] :
-         {std::pair(false, Way::On), {true, Way::On}, {true, Way::Back}, {true, Way::Resend}}) {
+         {std::pair(false, Way::On), {true, Way::On}, {true, Way::Back}, {true, Way::Resend}, {true, Way::ByHand}}) {
         Line line;
         SessionState& state = line.rig.state;
         state.Careful = careful;
@@ -66,6 +66,16 @@ TEST(FtpFrm, NamesWhatWasLeftOutAndCarefullyWaitsForTheAnswer) {
             EXPECT_EQ(state.shemot.n1, log.shemot.n1) << "not as the log has it";
             EXPECT_TRUE(state.handOver.back && !line.rig.test.files.folderExists(FtpFrmRig::folder()));
             continue;
+        }
+        if (way == Way::ByHand) {
+            line.rig.test.pump.onPump = [&] { page.Command4Hazor_Click(); };
+            page.cmdInternetOpen_Click();
+            line.rig.test.pump.onPump = nullptr;
+            ASSERT_EQ(line.rig.chain.front()->id(), PageId::FtpFrm) << "not in the middle of a step";
+            page.File1_Click(0);
+            page.Command3_Click();
+            EXPECT_EQ(line.lab.puts.size(), 1);
+            EXPECT_FALSE(shown.Command4Hazor.visible);
         }
         page.Command4Bli_Click();
         EXPECT_FALSE(shown.Pic4Hasserot.visible);

@@ -462,6 +462,25 @@ TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesAndIsReportedOnceW
     EXPECT_EQ(lab.reports.size(), 2);
 }
 
+TEST_F(UploadFormTest, TheWayBackToThePicturesEndsTheCheckAndLeavesNothingBehind) {
+    for (const bool careful : {false, true}) {
+        FakeWebLab other;
+        UploadFormRig back(other);
+        back.state.Careful = careful;
+        back.registerBare({PageId::kyoskNew});
+        back.state.handOver.basket = {u"021015GNBC:\\pics\\aabb.jpg"_s};
+        back.state.transfer.leftOut = {{u"C:\\pics\\gone.jpg"_path}};
+        other.onFetch = [&] { back.page().Command4Hazor_Click(); };
+        back.chain.show(PageId::UploadForm);
+        back.page().Form_Activate();
+        EXPECT_EQ(back.chain.front()->id(), PageId::kyoskNew);
+        EXPECT_EQ(back.chain.find(PageId::UploadForm), nullptr);
+        EXPECT_EQ(other.urls.size(), 1);
+        EXPECT_FALSE(back.test.files.folderExists(UploadFormRig::folder()));
+        EXPECT_TRUE(back.state.handOver.back && back.state.transfer.leftOut.isEmpty());
+    }
+}
+
 TEST_F(UploadFormTest, CarefullyAnOrderThatIsFoundThereIsReportedOnceByWhomeverItIsFound) {
     for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
         for (const bool careful : {true, false}) {

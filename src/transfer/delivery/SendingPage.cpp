@@ -127,8 +127,10 @@ Bitmap SendingPage::smallLeftOut(int index, int cell) const {
     return SmallLeftOut(m_state, m_platform.files, index, cell);
 }
 
+// Nothing has left the machine before the order is listed; a step by hand may still write into its folder.
 void SendingPage::goBack() {
-    if (!isUnderWay(m_phase) && m_leftOut.goBack())
+    const bool busy = isUnderWay(m_phase) || (lineInUse() && m_phase != SendingPhase::Preparing);
+    if (!busy && m_leftOut.goBack())
         TakeOrderBack(m_state, m_platform);
 }
 

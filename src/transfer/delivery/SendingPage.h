@@ -95,6 +95,8 @@ protected:
     bool prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken);
     const QString& reason() const { return m_reason; } // empty: no failure is to be told
     void tellLab();
+    // A file of the order may lie on a server.
+    void endWayBack() { m_leftOut.endWayBack(); }
     void leaveForNewOrder();
     void leaveProgram();
 

@@ -107,8 +107,10 @@ void FtpFrm::putChosen() {
     const QString name = lists().File1.currentItem();
     if (name.isEmpty())
         m_platform.dialogs.message(u"Please select a local file to put"_s);
-    else
+    else {
+        endWayBack();
         byHand([&] { m_sender.session.putHere(m_files.folder() / name); });
+    }
 }
 
 void FtpFrm::getChosen() {
