@@ -111,12 +111,11 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
     };
     for (const auto& c : cases) {
         ASSERT_TRUE(machine.files.writeWhole(u"C:\\2000lumora\\pratim.txt"_path, c.stored).ok());
-        const auto read = store.details();
-        ASSERT_TRUE(read.ok());
-        ASSERT_EQ(read->has_value(), c.found) << c.stored.toStdString();
+        const auto read = take(store.details());
+        ASSERT_EQ(read.has_value(), c.found) << c.stored.toStdString();
         if (c.found) {
-            EXPECT_EQ((*read)->name, c.name) << c.stored.toStdString();
-            EXPECT_EQ((*read)->telephone, c.telephone);
+            EXPECT_EQ(read->name, c.name) << c.stored.toStdString();
+            EXPECT_EQ(read->telephone, c.telephone);
         }
     }
 }
@@ -124,11 +123,11 @@ TEST_F(DetailStoreTest, ReadsShortAndForeignStoresWithoutHarm) {
 TEST_F(DetailStoreTest, AnAlbumFieldThatIsMissingMovesTheOthersUp) {
     ASSERT_TRUE(store.SaveAlbumDetails({u"Studio"_s, QString(), u"x"_s}).ok());
     EXPECT_EQ(take(machine.files.read(u"C:\\2000lumora\\pratim2.txt"_path)), "0\r\n\"Studio\"\r\n\"x\"\r\n0\r\n");
-    const auto read = store.albumDetails();
-    ASSERT_TRUE(read.ok() && *read);
-    EXPECT_EQ((*read)->name, u"Studio");
-    EXPECT_TRUE((*read)->telephone.isEmpty()) << "one character is too short to be taken";
-    EXPECT_TRUE((*read)->mailName.isEmpty());
+    const auto read = take(store.albumDetails());
+    ASSERT_TRUE(read);
+    EXPECT_EQ(read->name, u"Studio");
+    EXPECT_TRUE(read->telephone.isEmpty()) << "one character is too short to be taken";
+    EXPECT_TRUE(read->mailName.isEmpty());
 }
 
 } // namespace

@@ -368,7 +368,7 @@ TEST_F(FinishedOrders, AStoppedWalkGoesOnWithWhatIsUnsentWhereTheLabIsCareful) {
             tick(u"10:%1:00"_s.arg(minute).toLatin1().constData());
         EXPECT_EQ(machine.mail.messages.size(), careful ? 4 : 6);
         EXPECT_TRUE(page.walk().allSent());
-        EXPECT_EQ(ReadOrderState(machine.files, folder)->way, OrderState::Way::Mail);
+        EXPECT_EQ(take(ReadOrderState(machine.files, folder)).way, OrderState::Way::Mail);
         chain.unload(PageId::MoogMeret);
     }
     // Careful: fewer prints than the log names go only if the customer wants it, and none not at all.

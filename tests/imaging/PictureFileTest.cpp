@@ -6,6 +6,7 @@
 #include "imaging/scaling/Resample.h"
 #include "support/JpegQuality.h"
 #include "support/PictureDifference.h"
+#include "support/Take.h"
 
 #include <QBuffer>
 #include <QDir>
@@ -83,14 +84,13 @@ TEST_F(PictureFileTest, everyKindOfJpegShowsAndScalesTheSamePicture) {
             const Bitmap& original = originals[isGrey];
             const Bitmap& wanted = thirds[isGrey];
             const fs::path path = write("one.jpg", jpegOfKind(original, kind));
-            ASSERT_EQ(*readPictureSize(path), size);
-            const auto print = scalePictureToJpeg(path, third, 95);
-            ASSERT_TRUE(print);
-            EXPECT_EQ(print->at(print->indexOf("\xFF\xC0") + 9), 3) << "components";
-            EXPECT_EQ(jpegQuality(*print), 95);
+            ASSERT_EQ(take(readPictureSize(path)), size);
+            const QByteArray print = take(scalePictureToJpeg(path, third, 95));
+            EXPECT_EQ(print.at(print.indexOf("\xFF\xC0") + 9), 3) << "components";
+            EXPECT_EQ(jpegQuality(print), 95);
             const Result<Bitmap> made[] = {loadPicture(path), loadPictureScaled(path, third),
-                                           loadPicture(write("print.jpg", *print)),
-                                           Bitmap(QImage::fromData(*print, "JPEG"))};
+                                           loadPicture(write("print.jpg", print)),
+                                           Bitmap(QImage::fromData(print, "JPEG"))};
             for (const auto& [i, most] : {std::pair(0, 4.0), {1, 2.5}, {2, 5.0}, {3, 5.0}}) {
                 ASSERT_TRUE(made[i]);
                 EXPECT_LT(meanDifference(*made[i], i == 0 ? original : wanted), most) << i;
@@ -159,10 +159,8 @@ TEST_F(PictureFileTest, theContentAndNotTheEndingSaysWhatAFileIs) {
     const Bitmap picture = testPicture(60, 40);
     for (const char* format : {"BMP", "PNG"}) {
         const fs::path path = write("misnamed.jpg", saved(picture, format));
-        EXPECT_EQ(*readPictureSize(path), (PictureSize{60, 40}));
-        const auto loaded = loadPicture(path);
-        ASSERT_TRUE(loaded) << format;
-        EXPECT_EQ(meanDifference(*loaded, picture), 0);
+        EXPECT_EQ(take(readPictureSize(path)), (PictureSize{60, 40}));
+        EXPECT_EQ(meanDifference(take(loadPicture(path)), picture), 0) << format;
         EXPECT_TRUE(scalePictureToJpeg(path, {30, 20}, 90));
     }
     EXPECT_TRUE(loadPicture(write("really a jpeg.bmp", jpegOfKind(picture, {}))));
@@ -175,11 +173,10 @@ TEST_F(PictureFileTest, aWhiteOrTransparentPictureIsWhiteToItsEdgesAtEverySize) 
                                    PictureSize{13, 9}, PictureSize{1, 1}, PictureSize{500, 400}}) {
         const Bitmap wanted(size.width, size.height, Qt::white);
         for (const fs::path& path : {white, glass}) {
-            const auto printed = loadPicture(write("p.jpg", *scalePictureToJpeg(path, size, 90)));
-            ASSERT_TRUE(printed);
-            EXPECT_EQ(meanDifference(*printed, wanted), 0) << path;
+            const Bitmap printed = take(loadPicture(write("p.jpg", take(scalePictureToJpeg(path, size, 90)))));
+            EXPECT_EQ(meanDifference(printed, wanted), 0) << path;
         }
-        EXPECT_EQ(meanDifference(*loadPictureScaled(white, size), wanted), 0);
+        EXPECT_EQ(meanDifference(take(loadPictureScaled(white, size)), wanted), 0);
     }
     const fs::path clear = write("clear.jpg", *encodeJpeg(Bitmap(16, 16, QColor(255, 0, 0, 0)), 92));
     EXPECT_EQ(meanDifference(*loadPicture(clear), Bitmap(16, 16, Qt::white)), 0);

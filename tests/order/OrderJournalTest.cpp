@@ -2,6 +2,7 @@
 
 #include "order/OrderSender.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -111,7 +112,7 @@ TEST_F(AJournal, makesAStateForAnOrderThatHasNoneAtItsFirstStep) {
     const OrderFolder pieces(u"C:\\2026_11_21_KUP_1234^106P"_path);
     ASSERT_TRUE(test.files.makeFolder(pieces.path()));
     ASSERT_TRUE(OrderJournal(test.files, pieces).sendingBegins(Sender::Ftp, false));
-    EXPECT_EQ(ReadOrderState(test.files, pieces)->number, u"106"_s);
+    EXPECT_EQ(take(ReadOrderState(test.files, pieces)).number, u"106"_s);
 }
 
 TEST_F(AJournal, knowsTheFolderOfTheServerOnWhichItWasMade) {
@@ -147,7 +148,7 @@ TEST_F(AJournal, triesAgainWhatCouldNotBeWritten) {
     ASSERT_TRUE(test.files.makeFolder(u"C:\\none"_path));
     ASSERT_TRUE(test.files.makeFolder(gone.path()));
     EXPECT_TRUE(journal.take(printPath));
-    EXPECT_EQ(ReadOrderState(test.files, gone)->filesInHand.size(), 1);
+    EXPECT_EQ(take(ReadOrderState(test.files, gone)).filesInHand.size(), 1);
 }
 
 TEST_F(AJournal, tellsBySenderAndSheetHowAnOrderIsSentAgain) {

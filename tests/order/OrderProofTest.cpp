@@ -5,6 +5,7 @@
 #include "order/OrderLog.h"
 #include "order/PrintFileName.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -80,9 +81,8 @@ TEST(LineEnds, tellAServerThatChangesFilesFromOneThatCutsThem) {
     TestPlatform test;
     const QByteArray large = QByteArray(65535, 'x') + "\r\n\r";
     ASSERT_TRUE(test.files.writeWhole(u"C:\\large"_path, large));
-    const Result<LineEnds> read = LineEndsOf(test.files, u"C:\\large"_path);
-    ASSERT_TRUE(read);
-    EXPECT_TRUE(read->cr == 2 && read->lf == 1 && read->crlf == 1);
+    const LineEnds read = take(LineEndsOf(test.files, u"C:\\large"_path));
+    EXPECT_TRUE(read.cr == 2 && read.lf == 1 && read.crlf == 1);
     EXPECT_FALSE(LineEndsOf(test.files, u"C:\\none"_path));
 }
 
@@ -178,11 +178,10 @@ TEST(AnOrderNumber, belongsToTheFirstThatMakesItsFolder) {
     SessionState one = exampleOrder();
     one.DiskRoot = u"C:\\"_path;
     SessionState two = one;
-    const Result<OrderFolder> first = claimOrderFolder(one, test.files, OrderFolder::Ending::Plain);
-    const Result<OrderFolder> second = claimOrderFolder(two, test.files, OrderFolder::Ending::BySession);
-    ASSERT_TRUE(first && second);
+    const OrderFolder first = take(claimOrderFolder(one, test.files, OrderFolder::Ending::Plain));
+    const OrderFolder second = take(claimOrderFolder(two, test.files, OrderFolder::Ending::BySession));
     EXPECT_EQ(one.MisparHazmana + two.MisparHazmana, u"105106"_s);
-    EXPECT_NE(first->path(), second->path());
+    EXPECT_NE(first.path(), second.path());
 
     // An unfinished order of yesterday, in pieces, has the next number; a finished one of yesterday has none to keep.
     const DrivePath orders = u"C:\\2000lumora\\!!000"_path;

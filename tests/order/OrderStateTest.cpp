@@ -4,6 +4,7 @@
 #include "order/OrderChoices.h"
 #include "order/OrderFolder.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -32,9 +33,7 @@ OrderState unfinished() {
 }
 
 OrderState parsed(const OrderState& state) {
-    const Result<OrderState> read = OrderState::parse(state.write());
-    EXPECT_TRUE(read) << (read ? QString() : read.failure().message).toStdString();
-    return read ? *read : OrderState();
+    return take(OrderState::parse(state.write()));
 }
 
 TEST(AnOrderState, keepsEachStepOfTheSendingAndDropsTheBasketWhenItBegins) {
@@ -84,10 +83,8 @@ TEST(AnOrderState, isClearlyDamagedWhereverItIsCut) {
 }
 
 TEST(AnOrderState, keepsTheKeysOfALaterVersion) {
-    const Result<OrderState> read =
-        OrderState::parse("\"Phase\",\"sending\"\r\n\"Kiosk\",7\r\n\"Kiosk\",\"a%0Db\"\r\n\"End\",3\r\n");
-    ASSERT_TRUE(read);
-    const OrderState again = parsed(*read);
+    const OrderState again =
+        parsed(take(OrderState::parse("\"Phase\",\"sending\"\r\n\"Kiosk\",7\r\n\"Kiosk\",\"a%0Db\"\r\n\"End\",3\r\n")));
     ASSERT_EQ(again.further.size(), 2);
     EXPECT_EQ(again.further[0].value, u"7"_s);
     EXPECT_EQ(again.further[1].key + again.further[1].value, u"Kioska\rb"_s);
@@ -100,7 +97,7 @@ TEST(AnOrderState, liesHiddenInItsFolderAndIsMissedWhereThereIsNone) {
     ASSERT_TRUE(test.files.makeFolder(folder.path()));
     EXPECT_EQ(ReadOrderState(test.files, folder).failure().kind, Failure::Kind::NotFound);
     ASSERT_TRUE(WriteOrderState(test.files, folder, unfinished()));
-    EXPECT_EQ(ReadOrderState(test.files, folder)->items.size(), 2);
+    EXPECT_EQ(take(ReadOrderState(test.files, folder)).items.size(), 2);
     EXPECT_TRUE(test.files.names(folder.path(), u"*.*"_s).isEmpty());
     ASSERT_TRUE(test.files.writeWhole(folder.filePath(u".order"_s), "rubbish"));
     const Result<OrderState> damaged = ReadOrderState(test.files, folder);

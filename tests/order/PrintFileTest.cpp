@@ -5,6 +5,7 @@
 #include "order/TailTelephone.h"
 #include "support/DrivePathLiteral.h"
 #include "support/ExampleOrder.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>
@@ -23,9 +24,8 @@ QByteArray someBytes(int count) {
 
 TEST(PrintFile, isWrittenAsTheLabsToolsReadIt) {
     const QByteArray tail = OrderTail::of(exampleOrder()).shortForm();
-    const Result<QByteArray> file = packPrintFile("ABCDEFGHIJKLMN", {4, 30}, tail);
-    ASSERT_TRUE(file);
-    EXPECT_EQ(file->toHex().toUpper(),
+    const QByteArray file = take(packPrintFile("ABCDEFGHIJKLMN", {4, 30}, tail));
+    EXPECT_EQ(file.toHex().toUpper(),
               QByteArray("414243440100454647480200494A4B4C03004D4E00000400000033342020202020202020"
                          "31203120"
                          "30332D31323334353637"
@@ -43,13 +43,11 @@ TEST(PrintFile, hasTheSizeThatPieceAndRemainderGive) {
     for (const Case& c : {Case{100, 8, 12, 4, 166}, Case{10, 4, 2, 2, 68}, Case{0, 56, 0, 0, 162},
                           Case{14, 56, 0, 14, 176}, Case{28, 56, 0, 28, 190}, Case{84, 56, 2, 28, 302},
                           Case{112, 56, 2, 0, 274}, Case{100000, 56, 1786, 40, 100218}}) {
-        const Result<QByteArray> file = packPrintFile(someBytes(c.length), {c.chunks, 30}, QByteArray(40, ' '));
-        ASSERT_TRUE(file);
-        EXPECT_EQ(file->size(), c.size) << c.length;
-        const Result<PrintFileContent> content = readPrintFile(*file, {c.chunks, 30});
-        ASSERT_TRUE(content) << c.length;
-        EXPECT_EQ(content->piece, c.piece) << c.length;
-        EXPECT_EQ(content->remainder, c.remainder) << c.length;
+        const QByteArray file = take(packPrintFile(someBytes(c.length), {c.chunks, 30}, QByteArray(40, ' ')));
+        EXPECT_EQ(file.size(), c.size) << c.length;
+        const PrintFileContent content = take(readPrintFile(file, {c.chunks, 30}));
+        EXPECT_EQ(content.piece, c.piece) << c.length;
+        EXPECT_EQ(content.remainder, c.remainder) << c.length;
     }
 }
 
@@ -60,13 +58,11 @@ TEST(PrintFile, givesBackEveryPictureThatDoesNotEndInZeros) {
                 for (const int tailWidth : {40, 60, 0}) {
                     const QByteArray picture = someBytes(length);
                     const QByteArray tail = someBytes(tailWidth);
-                    const Result<QByteArray> file = packPrintFile(picture, {chunks, base}, tail);
-                    ASSERT_TRUE(file);
-                    const Result<PrintFileContent> content = readPrintFile(*file, {chunks, base});
-                    ASSERT_TRUE(content) << length << " bytes in " << chunks << " pieces, tail " << tailWidth;
-                    ASSERT_EQ(content->picture, picture)
+                    const QByteArray file = take(packPrintFile(picture, {chunks, base}, tail));
+                    const PrintFileContent content = take(readPrintFile(file, {chunks, base}));
+                    ASSERT_EQ(content.picture, picture)
                         << length << " bytes in " << chunks << " pieces, tail " << tailWidth;
-                    ASSERT_EQ(content->tail, tail);
+                    ASSERT_EQ(content.tail, tail);
                 }
             }
         }

@@ -177,7 +177,8 @@ TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
                  {true, "nnp", u"25"_s, 12},  {true, "nnpp", u"13"_s, 12}, {true, "pp", u"01"_s, 12},
                  {false, "ccc", u"14"_s, 1},  {true, "cc", u"13"_s, 2},    {true, "ccc", u"01"_s, 12},
                  {true, "cccp", u"13"_s, 12}, {true, "ccp", u"01"_s, 12},  {true, "ncp", u"25"_s, 12},
-                 {true, "cnp", u"01"_s, 12},  {true, "na", u"07"_s, 1},    {true, "nap", u"25"_s, 12}};
+                 {true, "cnp", u"01"_s, 12},  {true, "na", u"07"_s, 1},    {true, "nap", u"25"_s, 12},
+                 {true, "naapp", u"13"_s, 12}};
     for (const auto& c : cases) {
         Choosing at;
         at.state.Careful = c.careful;

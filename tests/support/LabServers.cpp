@@ -1,9 +1,10 @@
 #include "support/LabServers.h"
 
+#include "common/HostFile.h"
+
 #include <Poco/Net/ServerSocket.h>
 
 #include <QElapsedTimer>
-#include <QFile>
 #include <QThread>
 
 namespace lumora {
@@ -13,19 +14,19 @@ QString script(const char* name) {
     return QStringLiteral(LUMORA_LAB_SCRIPTS "/") + QLatin1String(name);
 }
 
-QByteArray contentOf(const HostPath& path) {
-    QFile file(toText(path));
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
 QByteArrayList linesOf(const HostPath& path) {
-    QByteArrayList lines = contentOf(path).split('\n');
+    QByteArrayList lines = std::filesystem::exists(path) ? contentOf(path).split('\n') : QByteArrayList();
     if (!lines.isEmpty() && lines.last().isEmpty())
         lines.removeLast();
     return lines;
 }
 
 } // namespace
+
+QByteArray contentOf(const HostPath& path) {
+    const Result<QByteArray> read = readWholeFile(path, toText(path), 1 << 30);
+    return read ? *read : QByteArray("<absent>");
+}
 
 quint16 FreePort() {
     const Poco::Net::ServerSocket socket(Poco::Net::SocketAddress("127.0.0.1", 0));

@@ -52,6 +52,9 @@ private:
     quint16 m_httpPort = 0;
 };
 
+// "<absent>" for a file that can't be read.
+QByteArray contentOf(const HostPath& path);
+
 // A port of 127.0.0.1 on which nothing listens at the moment.
 quint16 FreePort();
 

@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "support/Take.h"
 #include "support/TestPlatform.h"
 
 #include <gtest/gtest.h>

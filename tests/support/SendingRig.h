@@ -33,7 +33,7 @@ struct SendingRig : PageRig {
         std::map<QString, QByteArray> bytes;
         for (const QString& leaf : test.files.names(folder(), u"*.*"_s)) {
             if (leaf != list())
-                bytes[leaf] = *test.files.read(local(leaf));
+                bytes[leaf] = take(test.files.read(local(leaf)));
         }
         return bytes;
     }

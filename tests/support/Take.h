@@ -2,15 +2,17 @@
 
 #include "common/Result.h"
 
-#include <gtest/gtest.h>
+#include <stdexcept>
+#include <utility>
 
 namespace lumora {
 
-// What a call has given; after a failure the test fails and an empty value stands for it.
+// What a call has given. A failure ends the test, which fails with its message.
 template <class T>
-T take(const Result<T>& result) {
-    EXPECT_TRUE(result) << (result ? QString() : result.failure().message).toStdString();
-    return result ? *result : T();
+T take(Result<T> result) {
+    if (!result)
+        throw std::runtime_error(result.failure().message.toStdString());
+    return std::move(*result);
 }
 
 } // namespace lumora

@@ -155,7 +155,7 @@ TEST(LabArea, AConnectionByHandHoldsTheCountAndEndsBeforeASending) {
     Area area;
     OrderJournal order(area.rig.test.files, OrderFolder(FtpFrmRig::folder()));
     ASSERT_TRUE(order.reportBegun());
-    const auto inHand = [&] { return ReadOrderState(area.rig.test.files, order.folder())->filesInHand.size(); };
+    const auto inHand = [&] { return take(ReadOrderState(area.rig.test.files, order.folder())).filesInHand.size(); };
     FtpFrm& page = area.rig.start();
     page.Command3_Click();
     EXPECT_EQ(area.rig.test.dialogs.messages.last(), u"Not in session"_s);

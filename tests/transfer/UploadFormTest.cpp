@@ -2,7 +2,6 @@
 #include "order/OrderLog.h"
 #include "support/FakeWebLab.h"
 #include "support/RecordedSending.h"
-#include "support/Take.h"
 #include "support/UploadFormRig.h"
 
 #include <gtest/gtest.h>
@@ -210,7 +209,7 @@ TEST_F(UploadFormTest, CarefullyAFileArrivesInItsLength) {
                     << "a file that is proven is not asked for again";
             }
             if (careful && c.end == Success) {
-                EXPECT_EQ(ReadOrderState(cut.test.files, OrderFolder(UploadFormRig::folder()))->provenByNameOnly,
+                EXPECT_EQ(take(ReadOrderState(cut.test.files, OrderFolder(UploadFormRig::folder()))).provenByNameOnly,
                           c.byNameOnly);
             }
         }
@@ -317,8 +316,8 @@ TEST_F(UploadFormTest, CarefullyTheLogGoesFirstAndTheRestOnlyWhereItStaysThere) 
         EXPECT_EQ(faulty.posted.value(0), log);
         EXPECT_EQ(faulty.posted.size(), each.posted);
         EXPECT_EQ(faulty.uploads[name] == order.localFiles(), each.end == Success);
-        const Result<OrderState> kept = ReadOrderState(order.test.files, OrderFolder(UploadFormRig::folder()));
-        EXPECT_EQ(kept->folderMadeByUs, each.end == Success);
+        const OrderState kept = take(ReadOrderState(order.test.files, OrderFolder(UploadFormRig::folder())));
+        EXPECT_EQ(kept.folderMadeByUs, each.end == Success);
         EXPECT_EQ(faulty.reports.isEmpty(), each.end != Success);
     }
 }
@@ -398,7 +397,7 @@ TEST_F(UploadFormTest, AStopTakesEffectAtOnceAndTheSendingGoesOnFromThere) {
             stopped.send();
             EXPECT_EQ(stopped.page().phase(), SendingPhase::Stopped);
             EXPECT_EQ(other.aborts, 1);
-            EXPECT_EQ(ReadOrderState(stopped.test.files, OrderFolder(UploadFormRig::folder()))->items.isEmpty(),
+            EXPECT_EQ(take(ReadOrderState(stopped.test.files, OrderFolder(UploadFormRig::folder()))).items.isEmpty(),
                       !other.posted.isEmpty());
             EXPECT_LT(stopped.test.pump.count - pressedAt, 20);
             EXPECT_EQ(other.reports, QStringList());
@@ -454,8 +453,8 @@ TEST_F(UploadFormTest, AnOrderThatLacksAPictureOfItsLogArrivesAndIsReportedOnceW
     EXPECT_EQ(lab.uploads[UploadFormRig::name()], rig.localFiles());
     EXPECT_TRUE(rig.page().controls().Label4Do.text.contains(u"3 מתוך 4"_s));
     EXPECT_FALSE(rig.page().controls().Label4Count.visible) << "not the whole order went up";
-    const Result<OrderState> kept = ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder()));
-    EXPECT_TRUE(kept->phase == OrderState::Phase::Reported && kept->fewerAgreed);
+    const OrderState kept = take(ReadOrderState(rig.test.files, OrderFolder(UploadFormRig::folder())));
+    EXPECT_TRUE(kept.phase == OrderState::Phase::Reported && kept.fewerAgreed);
     rig.test.dialogs.answers = {true};
     rig.page().Command2_Click();
     EXPECT_EQ(rig.page().phase(), SendingPhase::AllThere);
@@ -474,10 +473,8 @@ TEST_F(UploadFormTest, TheWayBackToThePicturesEndsTheCheckAndLeavesNothingBehind
         back.chain.show(PageId::UploadForm);
         back.page().Form_Activate();
         EXPECT_EQ(back.chain.front()->id(), PageId::kyoskNew);
-        EXPECT_EQ(back.chain.find(PageId::UploadForm), nullptr);
         EXPECT_EQ(other.urls.size(), 1);
         EXPECT_FALSE(back.test.files.folderExists(UploadFormRig::folder()));
-        EXPECT_TRUE(back.state.handOver.back && back.state.transfer.leftOut.isEmpty());
     }
 }
 

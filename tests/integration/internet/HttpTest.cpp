@@ -4,7 +4,6 @@
 #include "support/ScriptedServer.h"
 
 #include <QElapsedTimer>
-#include <QFile>
 #include <QTemporaryDir>
 #include <QTimer>
 
@@ -115,9 +114,7 @@ TEST_F(HttpTest, GivesTheBodyWhateverTheStatusButDownloadsOnlyAGoodAnswer) {
     ASSERT_FALSE(inTheWay);
     EXPECT_EQ(inTheWay.failure().kind, Failure::Kind::Other) << "a trouble of this computer";
     ASSERT_TRUE(internet.download(good, target));
-    QFile file(toText(target));
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    EXPECT_EQ(file.readAll(), QByteArray("OK\r\n"));
+    EXPECT_EQ(contentOf(target), QByteArray("OK\r\n"));
 }
 
 TEST_F(HttpTest, FailsClearlyWhereThereIsNoAnswer) {

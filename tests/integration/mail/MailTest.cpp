@@ -12,12 +12,6 @@
 namespace lumora {
 namespace {
 
-QByteArray contentOf(const QString& path) {
-    QFile file(path);
-    EXPECT_TRUE(file.open(QIODevice::ReadOnly)) << path.toStdString();
-    return file.readAll();
-}
-
 class MailTest : public testing::Test {
 protected:
     MailTest() {
@@ -87,10 +81,11 @@ TEST_F(MailTest, AFileArrivesByteForByteWithSubjectBodyAndName) {
         reading.start(QStringLiteral(LUMORA_READ_MAIL), {box, folder.path()});
         ASSERT_TRUE(reading.waitForFinished(60'000));
         ASSERT_EQ(reading.exitCode(), 0) << reading.readAll().toStdString();
-        EXPECT_EQ(contentOf(folder.filePath(u"subject"_s)), message.subject.toUtf8());
-        EXPECT_EQ(QString::fromUtf8(contentOf(folder.filePath(u"body"_s))).remove(u'\r'), message.body);
-        EXPECT_EQ(contentOf(folder.filePath(u"name"_s)), toText(message.attachment.filename()).toUtf8());
-        EXPECT_TRUE(contentOf(folder.filePath(u"file"_s)) == contentOf(toText(message.attachment)));
+        const HostPath there = toHostPath(folder.path());
+        EXPECT_EQ(contentOf(there / "subject"), message.subject.toUtf8());
+        EXPECT_EQ(QString::fromUtf8(contentOf(there / "body")).remove(u'\r'), message.body);
+        EXPECT_EQ(contentOf(there / "name"), toText(message.attachment.filename()).toUtf8());
+        EXPECT_TRUE(contentOf(there / "file") == contentOf(message.attachment));
         QFile::remove(folder.filePath(u"file"_s));
     }
     // Encrypted where that was asked for, and logged in each time.
