@@ -15,6 +15,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 namespace lumora {
 
@@ -65,11 +66,11 @@ int widthOf(QString text, const QFont& font) {
 }
 
 // The largest font, from 16 down to 8 pixels, in which the text is no wider than room.
-QFont fittingFont(const QString& text, int room) {
+int fittingPixels(const QString& text, int room) {
     int pixels = lineFontPixels;
     while (pixels > leastFontPixels && widthOf(text, sheetFont(pixels)) > room)
         --pixels;
-    return sheetFont(pixels);
+    return pixels;
 }
 
 QStringList brokenToWidth(const QString& text, const QFont& font, int room) {
@@ -227,6 +228,28 @@ Result<Bitmap> sheetThumbnail(const std::filesystem::path& source) {
     return Bitmap(upright->image().transformed(QTransform().rotate(90)));
 }
 
+PlacedLines placeSheetLines(const QList<SheetLine>& lines, int sheetWidth) {
+    std::vector<PlacedText> texts;
+    const int room = sheetWidth - 2 * textStart.x();
+    int top = textStart.y();
+    for (const SheetLine& line : lines) {
+        // A break inside a remark starts a line of its own.
+        for (const QString& part : QString(line.text).remove(u'\r').split(u'\n')) {
+            const int pixels = fittingPixels(part, room);
+            const QFont font = sheetFont(pixels);
+            QStringList pieces = {part};
+            const bool inLog = !line.onlyHere && AnsiCodePage::squeeze(part) == part;
+            if (widthOf(part, font) > room)
+                pieces = inLog ? QStringList{shortenedToWidth(part, font, room)} : brokenToWidth(part, font, room);
+            const int pitch = QFontMetrics(font).lineSpacing();
+            for (qsizetype i = 0; i < pieces.size(); ++i)
+                texts.push_back({pieces[i], pixels, top + static_cast<int>(i) * pitch});
+            top += pieces.size() == 1 ? linePitch : std::max(linePitch, static_cast<int>(pieces.size()) * pitch);
+        }
+    }
+    return {std::move(texts), top};
+}
+
 OrderSheet::OrderSheet(SheetKind kind, PictureSize size, QColor background)
     : m_kind(kind)
     , m_size(size)
@@ -234,35 +257,14 @@ OrderSheet::OrderSheet(SheetKind kind, PictureSize size, QColor background)
     , m_bitmap(size.width, size.height, background) {}
 
 void OrderSheet::drawLines(const QList<SheetLine>& lines) {
-    struct Placed {
-        QString text;
-        QFont font;
-        int top;
-    };
-    std::vector<Placed> placed;
-    const int room = m_size.width - 2 * textStart.x();
-    int top = textStart.y();
-    for (const SheetLine& line : lines) {
-        // A break inside a remark starts a line of its own.
-        for (const QString& part : QString(line.text).remove(u'\r').split(u'\n')) {
-            const QFont font = fittingFont(part, room);
-            QStringList pieces = {part};
-            const bool inLog = !line.onlyHere && AnsiCodePage::squeeze(part) == part;
-            if (widthOf(part, font) > room)
-                pieces = inLog ? QStringList{shortenedToWidth(part, font, room)} : brokenToWidth(part, font, room);
-            const int pitch = QFontMetrics(font).lineSpacing();
-            for (qsizetype i = 0; i < pieces.size(); ++i)
-                placed.push_back({pieces[i], font, top + static_cast<int>(i) * pitch});
-            top += pieces.size() == 1 ? linePitch : std::max(linePitch, static_cast<int>(pieces.size()) * pitch);
-        }
-    }
-    m_added = std::max(0, top - firstRowTop());
+    const PlacedLines placed = placeSheetLines(lines, m_size.width);
+    m_added = std::max(0, placed.bottom - firstRowTop());
     if (m_added > 0)
         m_bitmap = Bitmap(m_size.width, m_size.height + m_added, m_background);
     QPainter painter(&m_bitmap.image());
     painter.setPen(Qt::black);
-    for (const Placed& line : placed) {
-        painter.setFont(line.font);
+    for (const PlacedText& line : placed.texts) {
+        painter.setFont(sheetFont(line.fontPixels));
         drawTextLine(painter, textStart.x(), line.top, line.text);
     }
 }

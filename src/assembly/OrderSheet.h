@@ -37,6 +37,21 @@ QList<SheetLine> plainSheetLines(const SessionState& state, const QDateTime& now
 QList<SheetLine> editedSheetLines(const SessionState& state, const QDateTime& now);
 QList<SheetLine> albumSheetLines(const SessionState& state, const QDateTime& now);
 
+// A line, or a piece of one, where it stands on the sheet, in pixels.
+struct PlacedText {
+    QString text;
+    int fontPixels;
+    int top;
+};
+struct PlacedLines {
+    std::vector<PlacedText> texts; // from the top
+    int bottom;
+};
+
+// A line that is too long is set smaller, down to 8 pixels; what is longer still is shortened with "...", or broken
+// where it is only here or has a letter that the log's code page lacks.
+PlacedLines placeSheetLines(const QList<SheetLine>& lines, int sheetWidth);
+
 // A picture of the contact sheet and the text below it. A cell without a source stays empty.
 struct SheetCell {
     std::optional<std::filesystem::path> source;
@@ -53,9 +68,7 @@ class OrderSheet {
 public:
     OrderSheet(SheetKind kind, PictureSize size, QColor background);
 
-    // A line that is too long is drawn smaller, down to 8 pixels; what is longer still is shortened with "...", or
-    // broken where it is only here or has a letter that the log's code page lacks. Lines that reach the pictures make
-    // the sheet higher. To be called once, before the pictures.
+    // Lines that reach the pictures make the sheet higher. To be called once, before the pictures.
     void drawLines(const QList<SheetLine>& lines);
 
     // Cells in rows from the left: columns 0 to cols and rows 1 to rows, both included, without the cells beyond them

@@ -30,29 +30,27 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(machine.files.names(folder(), u"*.*"_s),
               QStringList({u"!105_1234.jpp"_s, u"1 1015GNB0001_02736D616C6C.jpp"_s,
                            u"121015GNB0000_02FAEEE5F0E4203031.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s}));
-    const Result<PrintFileContent> content = unpacked(u"121015GNB0000_02FAEEE5F0E4203031.jpp"_s);
-    ASSERT_TRUE(content);
-    EXPECT_EQ(content->tail, "1 1 03-1234567Dana Levi 13 1051234      ") << "the short tail, whatever SugTzad says";
+    const PrintFileContent content = take(unpacked(u"121015GNB0000_02FAEEE5F0E4203031.jpp"_s));
+    EXPECT_EQ(content.tail, "1 1 03-1234567Dana Levi 13 1051234      ") << "the short tail, whatever SugTzad says";
     EditFields fields;
     UnpackEditState(edits, fields);
     EditedPrint request;
     request.file = host(portrait);
     request.paper = {10, 15};
-    EXPECT_EQ(content->picture, *renderEditedPrintToJpeg(request, fields));
-    EXPECT_EQ(jpegQuality(content->picture), 90);
+    EXPECT_EQ(content.picture, take(renderEditedPrintToJpeg(request, fields)));
+    EXPECT_EQ(jpegQuality(content.picture), 90);
 
-    EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{450, 580}));
+    EXPECT_EQ(take(readPictureSize(host(folder() / u"!105_1234.jpp"))), (PictureSize{450, 580}));
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
-    EXPECT_EQ(*readPictureSize(host(jobFolder / u"12~תמונה 01.bmp")), (PictureSize{300, 450}));
+    EXPECT_EQ(take(readPictureSize(host(jobFolder / u"12~תמונה 01.bmp"))), (PictureSize{300, 450}));
     EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path)) << "goes at the end of each step";
     EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(front(), PageId::FtpFrm);
     EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
-    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
-    ASSERT_TRUE(report);
-    EXPECT_EQ(report->faults, QStringList());
-    EXPECT_EQ(report->prints, 2);
+    const OrderFindings report = take(checkOrderFolder(host(folder()), {56, 30}));
+    EXPECT_EQ(report.faults, QStringList());
+    EXPECT_EQ(report.prints, 2);
 }
 
 TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
@@ -66,6 +64,21 @@ TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
         std::filesystem::remove_all(host(folder()));
         state.MisparHazmana = u"105"_s;
     }
+}
+
+TEST_F(PreparingAnEditedOrder, keepsItsCorrectionsAndNoThumbnailsOnTheWayBack) {
+    registerBare({PageId::kyoskNew});
+    state.TachanaMekomit = true;
+    const QString good = givePicture(u"good.jpg"_s);
+    giveCorrected(good, Qt::blue);
+    state.handOver.basket = {edited(good, record(redEyesCorrected)), edited(giveFile(u"bad.jpg"_s, "no picture"))};
+    B3& page = open(state.handOver.basket);
+    start(page);
+    EXPECT_EQ(machine.files.names(jobFolder, u"*.bmp"_s).size(), 1);
+    page.Command4Hazor_Click();
+    EXPECT_EQ(front(), PageId::kyoskNew);
+    EXPECT_TRUE(exists(correctedPath(good))) << "no clean-up";
+    EXPECT_EQ(machine.files.names(jobFolder, u"*.bmp"_s), QStringList());
 }
 
 // Flat pictures, so that one pixel tells which picture was printed and in which colours.
@@ -95,12 +108,10 @@ TEST_F(PreparingAnEditedOrder, printsTonesAndCorrectionsEachFromItsOwnPicture) {
     expectColour(print(5), middle, {grey(first).red(), grey(first).green(), grey(first).blue() / 2});
 
     // The last picture's copy; the corrected picture's is found under its own name too.
-    const auto copyOf = [this](const DrivePath& path) { return loadPicture(host(path)); };
-    ASSERT_TRUE(copyOf(bw));
-    EXPECT_EQ(copyOf(bw)->width(), 40) << "the size of the picture";
-    expectColour(copyOf(bw)->image(), {20, 15}, grey(first));
-    ASSERT_TRUE(copyOf(correctedPath(bw.text())));
-    expectColour(copyOf(correctedPath(bw.text()))->image(), {20, 15}, grey(fixed));
+    const auto copyOf = [this](const DrivePath& path) { return take(loadPicture(host(path))); };
+    EXPECT_EQ(copyOf(bw).width(), 40) << "the size of the picture";
+    expectColour(copyOf(bw).image(), {20, 15}, grey(first));
+    expectColour(copyOf(correctedPath(bw.text())).image(), {20, 15}, grey(fixed));
     EXPECT_EQ(machine.files.names(u"C:\\2000lumora"_path, u"*.bmp"_s), QStringList(u"bw.bmp"_s));
 }
 
@@ -185,7 +196,7 @@ TEST_F(PreparingAnEditedOrder, drawsTheSheetFromTheRenderedPrints) {
     const Changes turnedRed = {{EditRecord::GainR, u"0"_s}};
     prepare({edited(red), edited(green), edited(upright, record(turnedRed))});
     EXPECT_EQ(printFiles().size(), 3);
-    const QImage sheet = loadPicture(host(folder() / u"!105_1234.jpp"))->image();
+    const QImage sheet = take(loadPicture(host(folder() / u"!105_1234.jpp"))).image();
     // Cells lie every 82 pixels from 5, the first row at 161; a thumbnail is 80 wide and 53 high, also an upright one.
     expectColour(sheet, {5 + 40, 161 + 26}, Qt::green);
     expectColour(sheet, {87 + 76, 161 + 26}, Qt::black);
@@ -217,11 +228,10 @@ TEST_F(PreparingAnEditedOrder, savesSheetTailAndWayAsTheirReceiverWantsThem) {
             registerBare({PageId::UploadForm});
         start(openEither(edits, {edits ? edited(path) : line(path)}));
         EXPECT_EQ(machine.files.names(folder(), u"!*"_s), sheets);
-        EXPECT_EQ(checkOrderFolder(host(folder()), {56, 30})->faults, QStringList());
-        const Result<PrintFileContent> made = unpacked(printFiles().value(0));
-        ASSERT_TRUE(made);
-        EXPECT_EQ(made->tail, edits ? tail : tail + "^one_1              ") << "an edited order's is always short";
-        EXPECT_EQ(ReadOrderState(machine.files, OrderFolder(folder()))->way, way);
+        EXPECT_EQ(take(checkOrderFolder(host(folder()), {56, 30})).faults, QStringList());
+        const PrintFileContent made = take(unpacked(printFiles().value(0)));
+        EXPECT_EQ(made.tail, edits ? tail : tail + "^one_1              ") << "an edited order's is always short";
+        EXPECT_EQ(take(ReadOrderState(machine.files, OrderFolder(folder()))).way, way);
         EXPECT_EQ(front(), next);
         EXPECT_EQ(state.handOver.notice.contains(u"105"_s), next == PageId::hatchala);
         EXPECT_EQ(machine.dialogs.messages.size(), messages);

@@ -15,14 +15,13 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(machine.files.names(folder(), u"*.*"_s),
               QStringList({u"!105_1234.jpp"_s, u"1 1015GNB0001_01736D616C6C.jpp"_s,
                            u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s, u"2026_11_21_KUP_1234^105.txt"_s}));
-    const Result<PrintFileContent> print = unpacked(u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s);
-    ASSERT_TRUE(print);
-    EXPECT_EQ(print->picture, *resizeToPaper(host(portrait), {10, 15}));
-    EXPECT_EQ(print->tail, "1 1 03-1234567Dana Levi 13 1051234      ");
-    EXPECT_EQ(QImage::fromData(print->picture).size(), QSize(1200, 1600));
-    EXPECT_EQ(jpegQuality(print->picture), 90);
+    const PrintFileContent print = take(unpacked(u"121015GNB0000_01FAEEE5F0E4203031.jpp"_s));
+    EXPECT_EQ(print.picture, *resizeToPaper(host(portrait), {10, 15}));
+    EXPECT_EQ(print.tail, "1 1 03-1234567Dana Levi 13 1051234      ");
+    EXPECT_EQ(QImage::fromData(print.picture).size(), QSize(1200, 1600));
+    EXPECT_EQ(jpegQuality(print.picture), 90);
     EXPECT_EQ(jpegQuality(read(folder() / u"!105_1234.jpp")), 90);
-    EXPECT_EQ(*readPictureSize(host(folder() / u"!105_1234.jpp")), (PictureSize{500, 480}));
+    EXPECT_EQ(take(readPictureSize(host(folder() / u"!105_1234.jpp"))), (PictureSize{500, 480}));
 
     EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(state.MisparHazmana, u"105"_s) << "the number in memory stays this order's";
@@ -60,7 +59,8 @@ TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
         ASSERT_EQ(printFiles(number),
                   QStringList({u"1 1015GNB0000_016669727374.jpp"_s, u"1 1015GNB0003_017468697264.jpp"_s}))
             << "a failed picture leaves a hole in the numbers";
-        EXPECT_NE(unpacked(printFiles(number)[0], number)->picture, unpacked(printFiles(number)[1], number)->picture);
+        EXPECT_NE(take(unpacked(printFiles(number)[0], number)).picture,
+                  take(unpacked(printFiles(number)[1], number)).picture);
         const QByteArray log = read(logPath(number));
         EXPECT_TRUE(log.contains("\"-----------Total Failed\",\"2-----------\"\r\n"));
         EXPECT_TRUE(log.contains("\"More Comp = \"," + QByteArray::number(deep) + "\r\n"));
@@ -84,7 +84,7 @@ TEST_F(PreparingAPlainOrder, carefullyDecodesWhatItCopiesAndPassesOverWarnings) 
         const TextList& failed = page.controls().List4fail;
         page.Command6_Click();
         EXPECT_EQ(failed.items(), careful ? paths.mid(1) : QStringList());
-        EXPECT_EQ(unpacked(u"1 1015GNB0000_0173706F696C74.jpp"_s, state.MisparHazmana)->picture, spoilt);
+        EXPECT_EQ(take(unpacked(u"1 1015GNB0000_0173706F696C74.jpp"_s, state.MisparHazmana)).picture, spoilt);
         chain.unload(PageId::FtpFrm);
     }
 }
@@ -176,7 +176,7 @@ TEST_F(PreparingAPlainOrder, leavesTheNumberAndTheFilesOfUnfinishedAndOfFinished
     EXPECT_EQ(printFiles(u"107"_s).size(), 1);
     EXPECT_EQ(read(logPath(u"107"_s)), finished);
     EXPECT_EQ(printFiles(u"108"_s).size(), 2);
-    EXPECT_EQ(checkOrderFolder(host(folder(u"108"_s)), {56, 30})->faults, QStringList());
+    EXPECT_EQ(take(checkOrderFolder(host(folder(u"108"_s)), {56, 30})).faults, QStringList());
     EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "109\r\n");
 }
 
@@ -264,13 +264,12 @@ protected:
 
 TEST_F(PreparingAnAlbum, drawsItsOwnSheetWithTheContactSheetBelow) {
     openWith({albumLine(givePicture(u"one.jpg"_s))}).Command6_Click();
-    const Result<Bitmap> sheet = loadPicture(host(folder() / u"!105_1234.jpp"));
-    ASSERT_TRUE(sheet);
+    const Bitmap sheet = take(loadPicture(host(folder() / u"!105_1234.jpp")));
     const QColor ground(220, 220, 150);
     for (const auto& [at, wanted] : {std::pair(QPoint(490, 470), ground),
                                      {QPoint(5 + 40, 80 + 282 + 30), QColor(Qt::red)}, // row 1, column 0
                                      {QPoint(5 + 2 * 82 + 40, 80 + 282 + 30), ground}}) {
-        const QColor found = sheet->image().pixelColor(at);
+        const QColor found = sheet.image().pixelColor(at);
         EXPECT_LE(std::abs(found.red() - wanted.red()), 8) << at.x();
         EXPECT_LE(std::abs(found.blue() - wanted.blue()), 8) << at.x();
     }
@@ -284,10 +283,9 @@ TEST_F(PreparingAnAlbum, holdsTogetherForWhoReadsTheFolder) {
             .Command6_Click();
         EXPECT_TRUE(read(logPath(number)).contains("KUP_1234^105\"")) << "never with the P";
         chain.unload(PageId::FtpFrm);
-        const Result<OrderFindings> report = checkOrderFolder(host(folder(number)), PrintFileShape::of(state.profile));
-        ASSERT_TRUE(report);
-        EXPECT_EQ(report->faults.join(u'|'), QString());
-        EXPECT_EQ(report->copies, 3);
+        const OrderFindings report = take(checkOrderFolder(host(folder(number)), PrintFileShape::of(state.profile)));
+        EXPECT_EQ(report.faults.join(u'|'), QString());
+        EXPECT_EQ(report.copies, 3);
     }
 }
 

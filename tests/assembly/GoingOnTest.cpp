@@ -1,7 +1,6 @@
 #include "EditedOrder.h"
 
 #include "order/UnfinishedOrders.h"
-#include "support/Take.h"
 
 namespace lumora {
 namespace {
@@ -121,7 +120,7 @@ TEST_F(GoingOnWithAnOrder, TakesTheReplacedOrderAwayOnceTheNewOneIsWhole) {
     openWith({line(picture)}).Command3_Click();
     EXPECT_FALSE(machine.files.folderExists(folder()));
     EXPECT_EQ(printFiles(u"107"_s).size(), 1);
-    EXPECT_EQ(ReadOrderState(machine.files, OrderFolder(folder(u"107"_s)))->replaces, QString()) << "it is gone";
+    EXPECT_EQ(take(ReadOrderState(machine.files, OrderFolder(folder(u"107"_s)))).replaces, QString()) << "it is gone";
 }
 
 } // namespace

@@ -35,11 +35,11 @@ protected:
 };
 
 TEST_F(CheckingAnOrder, namesTheFileAtFault) {
-    const Result<OrderFindings> report = checkOrderFolder(host(folder()), {56, 30});
-    ASSERT_TRUE(report && report->faults.isEmpty());
-    EXPECT_EQ(QList({report->items, report->prints, report->failed, report->copies}), QList({4, 2, 1, 15}));
+    const OrderFindings report = take(checkOrderFolder(host(folder()), {56, 30}));
+    ASSERT_TRUE(report.faults.isEmpty());
+    EXPECT_EQ(QList({report.items, report.prints, report.failed, report.copies}), QList({4, 2, 1, 15}));
     // A print file whose picture is cut short still falls into its pieces.
-    const QByteArray tail = readPrintFile(read(folder() / two), {56, 30})->tail;
+    const QByteArray tail = take(readPrintFile(read(folder() / two), {56, 30})).tail;
     QByteArray picture = *encodeJpeg(noisyPicture(60, 60, 1), 90);
     picture.chop(picture.size() / 2);
     const QString sheet = u"!105_1234.jpp"_s;

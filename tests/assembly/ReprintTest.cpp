@@ -53,7 +53,7 @@ protected:
     QMap<int, QByteArray> packed() const {
         QMap<int, QByteArray> pictures;
         for (const QString& name : printFiles(state.MisparHazmana))
-            pictures[name.mid(9, 4).toInt()] = unpacked(name, state.MisparHazmana)->picture;
+            pictures[name.mid(9, 4).toInt()] = take(unpacked(name, state.MisparHazmana)).picture;
         return pictures;
     }
 };
@@ -64,9 +64,8 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
     ASSERT_EQ(prepare(items), QStringList());
     const QMap<int, QByteArray> first = packed();
     ASSERT_EQ(first.size(), 8);
-    EXPECT_EQ(checkOrderFolder(host(folder()), {56, 30})->faults, QStringList());
-    const Result<QByteArray> log = machine.files.read(logPath());
-    ASSERT_TRUE(log);
+    EXPECT_EQ(take(checkOrderFolder(host(folder()), {56, 30})).faults, QStringList());
+    const QByteArray log = take(machine.files.read(logPath()));
 
     chain.unload(PageId::FtpFrm);
     ASSERT_EQ(prepare(items), QStringList());
@@ -74,7 +73,7 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
     ASSERT_EQ(second.size(), 8);
 
     QStringList lines;
-    for (const ListOutputEntry& entry : ReadListOutput(*log)) {
+    for (const ListOutputEntry& entry : ReadListOutput(log)) {
         if (entry.key == QLatin1String("Shoora"))
             lines += entry.value;
     }
@@ -94,7 +93,7 @@ TEST_F(PrintingAgain, givesTheVeryBytesOfThePackedPrintFromTheLineOfTheLog) {
         ASSERT_EQ(render.exitCode(), 0) << render.readAllStandardError().constData();
         const QStringList made = QDir(out.path()).entryList(QDir::Files);
         ASSERT_EQ(made.size(), 1);
-        EXPECT_TRUE(*readHostFile(toHostPath(out.filePath(made[0]))) == first[i]);
+        EXPECT_TRUE(take(readHostFile(toHostPath(out.filePath(made[0])))) == first[i]);
     }
 }
 

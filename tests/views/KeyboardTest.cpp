@@ -1,5 +1,6 @@
 #include "Walk.h"
 
+#include "entry/details/nnn.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -114,6 +115,8 @@ TEST(Keyboard, StaysOnACardThatIsTaken) {
     press(walk, u"Image1(6)"_s);
     ASSERT_EQ(focusName(), u"Text1(0)"_s) << "the first box has the keyboard";
     text(u"Studio Or"_s);
+    tapAndType(walk, u"Combo4Mail"_s, u"lab.example"_s);
+    EXPECT_EQ(walk.page<nnn>(PageId::nnn).album().controls().Combo4Mail.text, u"lab.example"_s) << "no prompt";
     walk.key(Qt::Key_Return); // the main action
     EXPECT_EQ(focusName(), u"SoogAlb(0)"_s);
     press(walk, u"SoogAlb(1)"_s, Qt::Key_Space);

@@ -3,6 +3,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "views/kit/HoldButton.h"
+#include "views/kyoskNew/LargePicture.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 #include "views/window/ScreenDialogs.h"
@@ -50,6 +51,26 @@ TEST(Panel, LeavesThePageBelowInSightAndUsableWhereItIsNotCovered) {
     ASSERT_TRUE(window.viewBelow());
     EXPECT_EQ(window.frontView()->width(), 1920);
     walk.press(start, u"Check1"_s);
+}
+
+TEST(LargePicture, ShadesWhatThePaperDoesNotTake) {
+    const Theme theme(1);
+    LargePicture large(theme, nullptr);
+    large.resize(400, 400);
+    kyoskNewControls page;
+    for (const auto& [size, paper, taken, beside, white] :
+         {std::tuple(QSize(400, 300), QRectF(0, 0.1, 1, 0.8), QPoint(200, 88), QPoint(200, 72), false),
+          {QSize(300, 400), QRectF(0.1, 0, 0.8, 1), QPoint(88, 200), QPoint(72, 200), false},
+          {QSize(400, 300), QRectF(-0.1, 0, 1.2, 1), QPoint(42, 200), QPoint(26, 200), true},
+          {QSize(300, 400), QRectF(0, -0.1, 1, 1.2), QPoint(200, 42), QPoint(200, 26), true}}) {
+        page.Picture2.bitmap = Bitmap(size.width(), size.height(), Qt::red);
+        page.Picture2.paper = paper;
+        large.show(page.Picture2);
+        const QImage seen = large.grab().toImage();
+        EXPECT_EQ(seen.pixelColor(taken), QColor(Qt::red));
+        const QColor other = seen.pixelColor(beside);
+        EXPECT_TRUE(white ? other == Qt::white : other.red() < 200 && other.red() > other.green());
+    }
 }
 
 TEST(QuestionBox, AnswersWhatWasPressed) {
