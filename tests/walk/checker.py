@@ -14,9 +14,16 @@ ARRIVED = ('כל ההזמנה הגיעה', 'The whole order has arrived', 'מה 
 NOT_TYPED = 'לא הוקלד'
 GLOSSY, MATTE = ('מבריק', 'Glossy'), ('מט', 'Matte')
 BORDERS = {'ללא מסגרת': 'NB', 'No border': 'NB', 'מסגרת לבנה': 'WB', 'White border': 'WB'}
+WITH_MARGINS = 'כל התמונה על הנייר, עם שוליים', 'The whole picture, with margins'
+# What an album's bill shows in English, by what the order has.
+ALBUM = {'אינדיגו  סבתא': 'Indigo grandma', 'אינדיגו  ספירלה': 'Indigo spiral', 'אינדיגו הורים': 'Indigo parents', 'אינדיגו גדול': 'Indigo large',
+         'פוטו הורים': 'Photo parents', 'פוטו גדול': 'Photo large', 'חום': 'Brown', 'קרם': 'Cream', 'מבריק': 'Glossy', 'מט': 'Matte', 'משי': 'Silk'}
+EXTRAS = {'ללא': 'None', 'קנבס': 'Canvas', 'פלטה- סובלימציה': 'Sublimation plate', 'פרספקט': 'Perspex'}
 CELLS, CHUNKS, BASE, TAIL = 12, 56, 30, 40
-SAMPLE = 3  # prints of an order that are rendered again, beside those that the editor showed
+SAMPLE = 3  # prints of an order that are held against the customer's picture, beside those that the editor showed
+SIDE, TILE = 150, 8  # pixels: of the small pictures that are compared, and of their tiles
 TOLERANCE = 5  # mean difference of preview and print, of 255; it is 1 to 2 where nothing is wrong
+TILE_TOLERANCE = 16  # the same of the tile that differs most; it is 13 at most
 
 
 def plain(text):
@@ -66,11 +73,23 @@ def pixels(png):
     return width, rows
 
 
+def differences(one, other):
+    """Of two small pictures of about one size: the mean difference of all pixels, and that of the tile that differs most."""
+    width, height = min(one[0], other[0]), min(len(one[1]), len(other[1]))
+    tiles = {}
+    for y in range(height):
+        for x in range(width):
+            tile = tiles.setdefault((y // TILE, x // TILE), [0, 0])
+            tile[0] += sum(abs(a - b) for a, b in zip(one[1][y][x], other[1][y][x]))
+            tile[1] += 3
+    return sum(total for total, _ in tiles.values()) / (3 * width * height), max(total / count for total, count in tiles.values())
+
+
 class Order:
     """What the pages promised of an order: basket, texts and the paper of the editor by the picture's name."""
 
     def __init__(self):
-        self.basket, self.whole, self.total, self.paper, self.choice = {}, False, None, '', []
+        self.basket, self.whole, self.total, self.paper, self.choice, self.bill = {}, False, None, '', [], []
         self.details, self.closing, self.previews, self.withAddress, self.album = {}, {}, {}, False, False
 
 
@@ -78,7 +97,7 @@ class Walk:
     def __init__(self, record, data, lab, tools):
         self.record, self.data, self.lab, self.tools = record, data, lab, tools
         self.orders = self.prints = self.previews = self.arrived = 0
-        self.largest = 0  # difference of a print and what was seen
+        self.largest = self.worst = 0  # difference of a print and what was seen, and of a tile of it
         self.found = []
         self.lines = [json.loads(line) for line in (record / 'seen.jsonl').read_text().splitlines()]
 
@@ -100,6 +119,10 @@ class Walk:
                 folder = None
             elif page == 'nnn':
                 order.details.update(shown)
+                if 'Text2' in shown:  # the address is asked for only where it is wanted
+                    order.details['Text4'] = shown.get('Text4', '')
+                if 'Pic4Bil' in shown:
+                    order.bill = [row for text in line['words'] for row in plain(text).split('\n')]
                 if line['act'] == 'press nnn.Command10':  # what is remembered comes back unseen
                     order.details.pop('Text2', 0), order.details.pop('Text3', 0)
                 order.choice = next((plain(text).split(' · ') for text in line['words'] if ' · ' in text), order.choice)
@@ -201,15 +224,23 @@ class Walk:
             same('the photographer', field('ShemZalam'), name)
             same('the event', field('ShemErooa'), details.get('Text1(2)', ''))
             same('the mail address', field('MailZalam'), closing.get('Txt4Ml2', field('MailZalam')).strip())
+            bill = promise['bill']
+            for key in ('SoogLBM', 'GodelLBM', 'SoogKricha', 'SoogNiar'):
+                if field(key) not in bill and ALBUM.get(field(key)) not in bill:
+                    tell(f'{key} is {field(key)!r}, and the bill showed {bill}')
+            same('the extra', field('Tosafot1_1'), next((item for item, english in EXTRAS.items() if item in bill or english in bill), ''))
+            same('the special extras', [field(f'Tosafot2_{i}')[-2:] for i in range(1, 7)], [row[-2:] for row in bill if re.search('=[01]$', row)])
         else:
             name, telephone = details.get('Text2', field('n1')), details.get('Text3', field('n2'))
             same('the name', field('n1'), name)
             same('the telephone', field('n2'), telephone)
+            same('the delivery address', field('n3'), details.get('Text4', field('n3')).strip())
             same('the notes', field('Hearot').rpartition(' - ')[0], closing.get('Text2', ''))
             choice = promise['choice']
             same('the paper of the choice', paper, choice[0])
             kind = 'G' if choice[1] in GLOSSY else 'M' if choice[1] in MATTE else '?'
             bordered = [BORDERS.get(words, words.rpartition(' ')[2]) for words in choice[2:] if 'מסגרת' in words or 'order' in words]
+            same('fit or fill', field('FillFit'), 'FIT' if choice[-1] in WITH_MARGINS else 'FIL')
             if bordered:
                 same('the border', field('Bord'), bordered[0])
             border = field('Bord')[:2]
@@ -241,13 +272,16 @@ class Walk:
             for file in names:
                 picture, end = unpacked((folder / file).read_bytes())
                 same(f'the tail of {file}', end.decode('cp1255', 'replace'), ''.join(tail))
-                if file in chosen or file in names[:SAMPLE]:
-                    self.prints += 1
-                    record, path = wanted[file]
-                    preview = promise['previews'].get(self.leaf(path)) if edited else None
-                    for fault in self.comparePrint(pathlib.Path(scratch), picture, path, record, paper, field('More Comp = ') == '1',
-                                                   preview, folder.parent.parent / 'corrected'):
-                        tell(f'{file}: {fault}')
+                self.prints += 1
+                record, path = wanted[file]
+                deep = field('More Comp = ') == '1'
+                faults = self.comparePrint(pathlib.Path(scratch), picture, path, record, paper, deep, folder.parent.parent / 'corrected')
+                seen = promise['previews'].get(self.leaf(path)) if edited else self.source(path)
+                if seen and not deep and (file in chosen or file in names[:SAMPLE]):
+                    self.previews += edited
+                    faults += self.compareSeen(pathlib.Path(scratch), picture, seen)
+                for fault in faults:
+                    tell(f'{file}: {fault}')
         sheets = list(folder.glob('!*'))
         if not sheets or any(not path.read_bytes().startswith(b'\xff\xd8') for path in sheets):
             tell('no order sheet')
@@ -262,7 +296,7 @@ class Walk:
         done = subprocess.run([self.tools.render, *arguments], capture_output=True, text=True)
         return done.stderr.strip() if done.returncode else ''
 
-    def comparePrint(self, scratch, picture, path, record, paper, deep, preview, corrected):
+    def comparePrint(self, scratch, picture, path, record, paper, deep, corrected):
         source = self.source(path)
         if deep:
             return [] if picture == source.read_bytes() else ['is not the file of the customer']
@@ -272,21 +306,19 @@ class Walk:
         mode = ['print', '--record', record, '--frames', self.data / '2000lumora/misgarot'] if record else ['plain']
         if failure := self.render(*mode, '--paper', paper, '--out', scratch, '--', source):
             return [f'lumora-render fails: {failure}']
-        found = [] if (scratch / (source.stem + '.jpg')).read_bytes() == picture else ['is not what lumora-render makes of it']
-        seen = preview or (source if not record else None)
-        if not seen:
-            return found
-        self.previews += bool(preview)
+        return [] if (scratch / (source.stem + '.jpg')).read_bytes() == picture else ['is not what lumora-render makes of it']
+
+    def compareSeen(self, scratch, picture, seen):
         small = scratch / 'small'
         small.mkdir(exist_ok=True)
         (scratch / 'print.jpg').write_bytes(picture)
         (scratch / 'seen.jpg').write_bytes(seen.read_bytes())
-        if failure := self.render('small', '--size', '48', '--out', small, scratch / 'print.jpg', scratch / 'seen.jpg'):
-            return found + [f'lumora-render fails: {failure}']
+        if failure := self.render('small', '--size', str(SIDE), '--out', small, scratch / 'print.jpg', scratch / 'seen.jpg'):
+            return [f'lumora-render fails: {failure}']
         one, other = (pixels((small / name).read_bytes()) for name in ('print.png', 'seen.png'))
         if abs(one[0] - other[0]) > 1 or abs(len(one[1]) - len(other[1])) > 1:
-            return found + [f'has another shape than what was seen: {one[0]} x {len(one[1])}, {other[0]} x {len(other[1])}']
-        pairs = [(a, b) for row, line in zip(one[1], other[1]) for here, there in zip(row, line) for a, b in zip(here, there)]
-        difference = sum(abs(a - b) for a, b in pairs) / len(pairs)
-        self.largest = max(self.largest, difference)
-        return found + ([f'differs by {difference:.1f} from what was seen'] if difference > TOLERANCE else [])
+            return [f'has another shape than what was seen: {one[0]} x {len(one[1])}, {other[0]} x {len(other[1])}']
+        difference, worst = differences(one, other)
+        self.largest, self.worst = max(self.largest, difference), max(self.worst, worst)
+        return [f'differs by {difference:.1f} from what was seen, and by {worst:.1f} in a tile'] if \
+            difference > TOLERANCE or worst > TILE_TOLERANCE else []

@@ -194,6 +194,13 @@ bool isMarked(const QWidget& widget) {
     return button && button->isChecked();
 }
 
+// Without the box that a caption is dragged by, which is no part of the print.
+QPixmap paperAlone(QWidget& paper) {
+    QPixmap drawn(paper.size());
+    paper.render(&drawn, {}, {}, QWidget::DrawWindowBackground);
+    return drawn;
+}
+
 // A control is named by the row of the table itself or is a member of the group that the row names.
 bool goesBy(const QWidget& widget, const QString& name) {
     return widget.objectName() == name || widget.objectName().startsWith(name + u'(');
@@ -295,7 +302,7 @@ void RandomWalk::keepPaper(const PageView* view, const QString& title) {
     if (!m_paper.isNull() && (!isShown || title != m_title))
         m_paper.save(QDir(m_plan.record).filePath(u"preview.%1.png"_s.arg(m_paperLine)), "PNG", 89);
     m_title = title;
-    m_paper = isShown ? paper->grab() : QPixmap();
+    m_paper = isShown ? paperAlone(*paper) : QPixmap();
     m_paperLine = m_line;
 }
 
