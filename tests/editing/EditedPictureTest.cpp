@@ -166,8 +166,8 @@ TEST_F(EditedPictureTest, aCaptionHasItsColourPlaceSizeAndStyleInPreviewAndPrint
     base.TextFont = u"DejaVu Sans"_s;
     base.TextBody = u"HH\r\nH"_s;
     base.TextFontSize = 40;
-    base.TextX = 200;
-    base.TextY = 100;
+    base.TextX = 2000; // the record has the first three digits
+    base.TextY = 1000;
     base.TextRed = 250;
     base.TextGreen = 30;
     base.TextBlue = 90;
@@ -222,6 +222,8 @@ TEST_F(EditedPictureTest, aPreviewForALargerScreenIsTheSamePicture) {
     EXPECT_EQ(opened->render(edit, frame).image(), small.image())
         << "what is kept for one scale leaves the other alone";
     EXPECT_GT(differenceOf(small, opened->render(edit, std::nullopt)), 3.0) << "a frame that is taken off is gone";
+    opened->turnGrey();
+    EXPECT_LE(differenceOf(opened->render(edit, frame), opened->render(edit, frame, 2)), 3.0);
 }
 
 TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
@@ -232,8 +234,9 @@ TEST_F(EditedPictureTest, framesAreTakenFromTheirFolderOnly) {
         const auto loaded = loadFrame(path("frames"), edit, use);
         return loaded ? QColor(loaded->image().pixel(0, 0)) : QColor();
     };
+    saveFrame("frames/blue/ab.bmp", Qt::cyan);
     EXPECT_EQ(frame("blue", "ab", FrameUse::Preview), QColor(Qt::green));
-    EXPECT_EQ(frame("blue", "ab", FrameUse::Print), QColor(Qt::green));
+    EXPECT_EQ(frame("blue", "ab", FrameUse::Print), QColor(Qt::cyan));
     EXPECT_EQ(frame("blue", "cd", FrameUse::Print), QColor(Qt::yellow)) << "what was seen is printed";
     std::filesystem::rename(path("frames/blue/kcd.bmp"), path("frames/blue/KCD.Bmp"));
     EXPECT_EQ(frame("blue", "cd", FrameUse::Preview), QColor(Qt::yellow)) << "letter case does not count";

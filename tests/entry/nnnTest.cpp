@@ -302,9 +302,6 @@ TEST_F(nnnTest, CleansTheHistoryOnceItIsAskedAndCarefullyKeepsWhatMayNotHaveArri
         state.Careful = c.careful;
         machine.dialogs.answers = c.answers;
         machine.dialogs.messages.clear();
-        Havharot notice(state, machine.platform, chain);
-        notice.setTexts();
-        EXPECT_TRUE(notice.controls().Label1.text.contains(c.careful ? u"קודמות שהגיעו."_s : u"קודמות."_s));
         page.Command14_Click();
         EXPECT_TRUE(shown.Frame1.visible && shown.Command7.visible);
         EXPECT_TRUE(shown.Frame1.text.endsWith(u"הזמנות שלא הוכח שהגיעו: 2; של התחנה: 1; שיצאו בדואר: 1."))

@@ -175,6 +175,11 @@ FAULTS = {
     'src/order/HistoryState.cpp': [
         F('order->phase >= OrderState::Phase::Arrived', 'order->phase >= OrderState::Phase::Prepared', 'clean-up takes orders that were never sent'),
         F('state.Careful && count() > 0', 'false', 'clean-up asks nothing')],
+    'src/order/CompletenessGuard.cpp': [F('return askForFewer(counts);', 'return true;', 'an order that lacks pictures leaves unasked')],
+    'src/order/LeftOutPictures.cpp': [
+        F('static_cast<void>(files.removeFile(thumbnails / name));', 'static_cast<void>(name);', 'the next sheet shows pictures of the one before', seen=True),
+        F('HasQuestionMark(path) ? LeftOut::Why::Name : LeftOut::Why::NotTold', 'LeftOut::Why::NotTold',
+          'nobody is told that the name of a picture is at fault')],
     'src/order/LineEnds.cpp': [F('return {-cr, -crlf, lf, lf - crlf};', 'return {-cr, -crlf, lf, lf};', 'a server that adds CR is not recognised')],
 
     'src/platform/line/FtpListing.cpp': [
@@ -220,6 +225,10 @@ FAULTS = {
         F('std::clamp(quality, 0, 100)', '75', 'prints are coarser than ordered'),
         F('onWhite(picture).image()', 'picture.image()', 'what is transparent prints black')],
     'src/imaging/files/JpegReader.cpp': [F('inverted ? inks[ink] : 255 - inks[ink]', '255 - inks[ink]', 'pictures for the press print as negatives')],
+    'src/imaging/files/JpegCheck.cpp': [
+        F('input->format() != PictureInput::Format::Jpeg', 'false', 'another kind of file goes to the lab as a JPEG',
+          told='the reader of JPEG files refuses it as well, in other words'),
+        F('picture ? Result<void>() : picture.failure()', 'Result<void>()', 'a file that is no picture goes to the lab as a print')],
     'src/imaging/files/BmpFile.cpp': [F('(width * pixelSize + 3) / 4 * 4', 'width * pixelSize', 'previews and corrected copies lean')],
     'src/imaging/drawing/ColourPlanes.cpp': [F('qRed(line[x])', 'qBlue(line[x])', 'prints have no red')],
     'src/imaging/drawing/ColourMatrix.cpp': [
@@ -266,6 +275,15 @@ FAULTS = {
         F('code(PrintCode::copiesOf(m_basket.item(index)), PaperWords::All)', 'code(1, PaperWords::All)', 'editing takes the copies back'),
         F('m_state.Careful ? PaperWords::All : PaperWords::WholeFolder', 'PaperWords::WholeFolder', 'a whole folder in English has no paper',
           seen=True)],
+    'src/selection/OrderResolution.cpp': [
+        F('m_state.DchisaAmoka == 1', 'false', 'a picture that is sent whole is called coarse',
+          told='only a panorama, and the order is the same'),
+        F('resolution->grade() == PrintResolution::Grade::Coarse', 'resolution->grade() != PrintResolution::Grade::Sharp',
+          'fair pictures are called coarse'),
+        F('record.isEmpty() ? EditRecord::newPicture() : record', 'EditRecord::newPicture()', 'a zoomed picture is not told to be coarse')],
+    'src/selection/SeenPages.cpp': [
+        F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty'),
+        F('m_state.Careful && start + cellsOfPage >= lines', 'false', 'one of many chosen pictures is shown')],
     'src/selection/HomeAddress.cpp': [F('m_state.BranchChoice == home', 'false', 'prints are to be delivered nowhere')],
     'src/selection/pictures/kyoskNewFinish.cpp': [
         F('Text2.text + u" - "_s + m_state.BranchChoice', 'Text2.text', 'the lab does not learn the branch', seen=True),
@@ -292,6 +310,21 @@ FAULTS = {
         F('store.text(customer.telephone).endLine();', 'store.text(customer.name).endLine();', 'the name comes back as the telephone'),
         F('line.size() > 4 ? WithoutEnds(line) : QString()', 'WithoutEnds(line)', 'a sign of the store comes back as a name')],
 
+    'src/editing/render/EditedPicture.cpp': [
+        F('edit.TextAlign == R::alignFar', 'false', 'a caption at the far side prints at the near one'),
+        F('(edit.TextStyle & 2) != 0', 'false', 'an italic caption prints upright'),
+        F('R::stored(R::TextY, edit.TextY)', 'edit.TextY', 'a caption is seen where the record can not have it'),
+        F('edit.ToneFlag == 1 ? loadGreyPart(print, wanted, part) : loadPicturePart(print.file, wanted, part)',
+          'loadPicturePart(print.file, wanted, part)', 'a grey picture prints in colour'),
+        F('coloursOf(edit).apply(picture);', '', 'brightness is seen and not printed'),
+        F('{geometry.scaleX, geometry.scaleY}', '{geometry.scaleX, MUTATED ? geometry.scaleX : geometry.scaleY}', 'a caption prints in another height',
+          told='the two are one for each paper'),
+        F('QStringList{name, seen}', 'QStringList{seen, name}', 'the frame of the screen prints'),
+        F('coversPaper(edit) && printPlacement(m_file, print, edit).covers(print.size)', 'coversPaper(edit)',
+          'a turned picture covers the preview and not the print', told='the two differ by rounding alone'),
+        F('placement.panX *= scale;', '', 'on a sharp screen a moved picture is seen beside its place'),
+        F('m_sharp = grey.applied(m_sharp);', '', 'on a sharp screen a grey picture is seen in colour'),
+        F('!print.background && !(shows && placement.covers(geometry.size))', 'false', 'what the picture leaves bare prints white')],
     'src/editing/render/PicturePlacement.cpp': [
         F('height < box.height', 'height > box.height', 'the preview shows white that is not printed'),
         F('print.size.height > placement.drawHeight', 'print.size.height < placement.drawHeight', 'prints have white edges'),
@@ -301,6 +334,12 @@ FAULTS = {
     'src/editing/render/TextLabelPlace.cpp': [F('box.left -= box.width / 2;', '', 'the label of a caption stands beside it')],
     'src/editing/render/FrameScramble.cpp': [F('bytes->mid(2 * block)', 'bytes->mid(block)', 'packed frames are damaged')],
     'src/editing/render/FrameLists.cpp': [F('name.size() <= longestCategory', 'true', 'a frame is chosen whose folder the record cuts')],
+    'src/editing/editor/CoverZoom.cpp': [
+        F('m_own = std::exchange(edit.ZoomPercent, raised);', 'edit.ZoomPercent = raised;', "the customer's own zoom does not come back"),
+        F('isRaisedToTheLast(edit) || picture.coversPaper(edit)', 'picture.coversPaper(edit)', 'the zoom jumps with each turn')],
+    'src/editing/editor/SeenFrame.cpp': [
+        F('edit.FrameName = EditRecord::frameRemoved;', '', 'a frame that is not seen prints'),
+        F('m_state.Careful || before', 'before', 'a frame is taken, prints and is not seen')],
     'src/editing/editor/EditLimits.cpp': [F('edit.RotationCode < least', 'false', 'a turn takes four columns'),
                                           F('std::clamp<std::int16_t>(edit.TextFontSize, 8, 98)', 'edit.TextFontSize',
                                             'a caption of size 100 prints as 10')],
@@ -308,9 +347,33 @@ FAULTS = {
         F('EditStep::gain(1, -20)', 'EditStep::gain(1, 20)', 'sepia is violet'),
         F('EditStep::gain(edit.GainB, -step)', 'edit.GainB', 'more red leaves blue'),
         F('edit.ToneFlag = 1;', '', 'a grey picture prints in colour')],
+    'src/editing/editor/tFrmNew.cpp': [
+        F('workPicture()->placeAtCentreIfUnset(m_edit);', '', 'a picture that was opened once has no place'),
+        F('m_edit.RedMarker = EditRecord::notMarked;', '', 'a picture whose correction is lost has no print'),
+        F('m_edit.ToneFlag == 1', 'false', 'a grey picture opens in colour'),
+        F('m_edit.GainR = m_edit.GainG = m_edit.GainB = 1;', '', 'the next picture takes the brightness of the one before')],
+    'src/editing/editor/tFrmNewCaption.cpp': [
+        F('m_edit.TextY = static_cast<std::int16_t>(anchor.y());', '', 'a dragged caption prints at its former height'),
+        F('m_captionGuard.keepsDraggedPlace()', 'false', 'a dragged caption prints at its former place')],
+    'src/editing/editor/tFrmNewFrames.cpp': [
+        F('m_edit.FrameFolder = Combo4.text;', '', 'the frame of another category prints'),
+        F('m_edit.FrameName = EditRecord::frameRemoved;', '', 'a frame that was taken away prints')],
     'src/editing/editor/tFrmNewMove.cpp': [F('PackEditState();', '', 'a zoom is shown and not printed'),
                                            F('meanwhile.PanX = HoldIn16Bits(Image3.position().x());', '', 'a dragged picture does not follow',
-          told='the record and the print are right once the finger is lifted')],
+          told='the record and the print are right once the finger is lifted'),
+                                           F('opening != m_openings', 'false', 'the zoom of one picture is stored with another',
+                                             told='the picture that came has a zoom of its own by then'),
+                                           F('PreviewZoom = m_edit.ZoomPercent;', '', 'a held zoom jumps after a turn')],
+    'src/editing/caption/CaptionStep.cpp': [
+        F('edit.TextY + down', 'edit.TextY - down', 'the arrow moves the caption the other way'),
+        F('edit.TextStyle > 2', 'edit.TextStyle > 1', 'no caption is bold and italic')],
+    'src/editing/caption/mikledet.cpp': [
+        F('m_edit.TextOn = on ? 1 : 0;', 'm_edit.TextOn = 1;', 'a caption that was taken off prints'),
+        F('m_edit.TextFont = Combo1.text;', '', 'the caption prints in another font than was chosen', told='no page fills the list of fonts'),
+        F('m_edit.TextAlign = static_cast<std::int16_t>(alignment);', '', 'the caption prints at another side than was chosen')],
+    'src/editing/redeye/KeptCorrection.cpp': [
+        F('goesOn ? copy : picture', 'picture', 'a second visit throws the first correction away'),
+        F('m_state.Careful && !picture.differsFromFile()', 'false', 'a picture without a correction is marked as corrected')],
     'src/editing/caption/CaptionGuard.cpp': [F('edit.TextOn = 1;', '', 'a caption that is opened again is not printed')],
     'src/editing/caption/KeyLayout.cpp': [F('AnsiCodePage::squeeze(text) != text', 'false', 'a caption shows signs that the record has not')],
 
@@ -329,6 +392,13 @@ FAULTS = {
         F('m_size.width / sheetCellSize - 2', 'm_size.width / sheetCellSize - 1', 'more pictures than the sheet has room for'),
         F('ratio >= 1', 'ratio > 1', 'square pictures stand on the sheet'),
         F('return {255, 192, 255};', 'return {255, 255, 192};', 'mixed sizes are not marked by their colour')],
+    'src/assembly/PaperResize.cpp': [
+        F('scalePictureToJpeg(source, target, printQuality)', 'scalePictureToJpeg(source, target, 70)', 'plain prints are coarser than agreed')],
+    'src/assembly/PrintPacker.cpp': [
+        F('m_files.fileExists(print) ? m_files.removeFile(print) : Result<void>()', 'Result<void>()', 'half of a print that the log names as failed is sent'),
+        F('static_cast<void>(picture());', '', 'a print that was made ahead comes out as its neighbour',
+          told='two removals in a row must fail on a disk that takes all writes'),
+        F('m_tail.form(m_tailForm, base)', 'm_tail.form(m_tailForm, line.code)', 'the tail names another picture')],
     'src/assembly/plain/PlainPreparation.cpp': [
         F('ending == u"JPG" || ending == u"jpg"', 'ending == u"jpg"', 'pictures of most cameras are left out'),
         F('!there.contains(i) && picture.hasUsableName() && !HasQuestionMark(items[i])', '!there.contains(i) && picture.hasUsableName()',
@@ -340,6 +410,14 @@ FAULTS = {
         F('OrderTail::shortWidth', 'OrderTail::longWidth', 'edited orders have a tail that the lab does not read'),
         F('name.size() - 8', 'name.size() - 4', 'captions of the sheet are longer',
           told='the ending stands in a caption too; log and print carry the name')],
+    'src/assembly/edited/KeptWork.cpp': [
+        F('copy == line.path || !m_files.fileExists(copy)', 'true', 'corrections are not kept aside'),
+        F('static_cast<void>(m_files.keepCopy(kept / name, scratch / name));', 'static_cast<void>(name);',
+          'corrections that were kept aside do not come back')],
+    'src/assembly/edited/OpenedRecords.cpp': [
+        F('placeAtCentreIfUnset(edit, previewBox(*m_paper, orientationOf(*size)));', '', 'a picture that was never opened prints stretched'),
+        F('line.editState.trimmed().isEmpty() ? EditRecord::newPicture() : line.editState', 'line.editState',
+          'a blank record has no place')],
     'src/assembly/edited/EditedPrints.cpp': [F('edit.ToneFlag != 1', 'true', 'grey pictures print in colour')],
 
     'src/transfer/ftp/FtpArrival.cpp': [

@@ -197,7 +197,7 @@ TEST_F(ThePictures, areGradedLargeAndTurnInFourClicks) {
 }
 
 TEST_F(ThePictures, thatWillPrintCoarseAreToldOfAndShownTwelveAtATimeBeforeTheyAreSent) {
-    makePictures(u"C:\\q"_path, 1, {1600, 1100});
+    makePictures(u"C:\\q"_path, 1, {1000, 700});
     kyoskNew& page = openWith(14);
     const kyoskNewControls& shown = page.controls();
     ASSERT_TRUE(saveJpeg(Bitmap(30, 40, Qt::red), host(u"C:\\p\\13.jpg"_path), 80)); // upright
