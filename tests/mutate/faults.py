@@ -282,7 +282,8 @@ FAULTS = {
           'fair pictures are called coarse'),
         F('record.isEmpty() ? EditRecord::newPicture() : record', 'EditRecord::newPicture()', 'a zoomed picture is not told to be coarse')],
     'src/selection/SeenPages.cpp': [
-        F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty'),
+        F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty',
+          told='the reading position does not go behind the last line'),
         F('m_state.Careful && start + cellsOfPage >= lines', 'false', 'one of many chosen pictures is shown')],
     'src/selection/HomeAddress.cpp': [F('m_state.BranchChoice == home', 'false', 'prints are to be delivered nowhere')],
     'src/selection/pictures/kyoskNewFinish.cpp': [
