@@ -55,10 +55,11 @@ protected:
         makeFolder(u"C:\\p"_path);
         const QByteArray jpeg = saved(picture, "JPG");
         put(u"a.jpg"_s, jpeg);
-        put(u"b.jpg"_s, jpegWith(jpeg, exif(6)));
+        const QByteArray turned = jpegWith(jpeg, exif(6, false, saved(patches(16, 12), "JPG")));
+        put(u"b.jpg"_s, turned);
         put(u"café.jpg"_s, jpeg);
         put(u"d.heic"_s, heif(picture, {}));
-        put(u"e.png"_s, saved(picture, "PNG").left(200));
+        put(u"e.jpg"_s, turned.left(turned.size() * 7 / 10));
         put(u"f.txt"_s, "no picture");
         put(u"g.webp"_s, "empty");
     }
@@ -97,9 +98,11 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     const kyoskNewControls& shown = page.controls();
     EXPECT_EQ(shown.pictureCount.text, u"6 pictures"_s);
     EXPECT_TRUE(shown.Picture1[3].waiting) << "its turn comes while the customer looks";
+    for (const std::size_t draft : {1, 4})
+        EXPECT_GT(shown.Picture1[draft].bitmap.height(), shown.Picture1[draft].bitmap.width()) << draft;
     EXPECT_EQ(shown.Picture1[5].unreadable, u"unknown kind of file"_s) << "told by its header";
     waitForCells(page);
-    const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.png"_s, u"g.webp"_s};
+    const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.jpg"_s, u"g.webp"_s};
     for (std::size_t cell = 0; cell < 6; ++cell) {
         EXPECT_EQ(shown.Picture1[cell].name, names[qsizetype(cell)]);
         EXPECT_EQ(shown.Picture1[cell].bitmap.isNull(), cell > 3) << cell;
@@ -153,7 +156,7 @@ TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
     EXPECT_FALSE(page.controls().doorPanel.visible);
     EXPECT_EQ(page.controls().Label20.text, u"17"_s);
     EXPECT_EQ(machine.dialogs.messages,
-              QStringList(u"These pictures can't be read and were taken out of the order:\ne.png\nz13.png"_s));
+              QStringList(u"These pictures can't be read and were taken out of the order:\ne.jpg\nz13.png"_s));
 }
 
 TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
@@ -217,7 +220,7 @@ TEST_F(TheDoor, OffersAndUsesJpegFilesAsTheyLieUnlessTheLabAsksForMore) {
     state.door = {};
     kyoskNew& asBuiltIn = openWithTheFolder();
     EXPECT_EQ(asBuiltIn.controls().List2.items(),
-              QStringList({u"C:\\p\\a.jpg"_s, u"C:\\p\\b.jpg"_s, u"C:\\p\\caf?.jpg"_s}));
+              QStringList({u"C:\\p\\a.jpg"_s, u"C:\\p\\b.jpg"_s, u"C:\\p\\caf?.jpg"_s, u"C:\\p\\e.jpg"_s}));
     EXPECT_FALSE(machine.files.folderExists(DrivePath(doorFolder)));
     chain.unload(PageId::kyoskNew);
     state.door.upright = true;
@@ -225,7 +228,7 @@ TEST_F(TheDoor, OffersAndUsesJpegFilesAsTheyLieUnlessTheLabAsksForMore) {
     kyoskNew& upright = openWithTheFolder();
     const QStringList paths = upright.controls().List2.items();
     EXPECT_EQ(paths.first(), u"C:\\p\\a.jpg"_s) << "its colours are as stored";
-    EXPECT_TRUE(paths.value(1).startsWith(doorFolder) && paths.size() == 3);
+    EXPECT_TRUE(paths.value(1).startsWith(doorFolder) && paths.size() == 4);
 }
 
 TEST_F(TheDoor, KeepsTheFoldersOfOrdersThatMayStillBePreparedAndNoOther) {

@@ -172,6 +172,8 @@ DrivePath kyoskNew::pictureToDraw(const QString& path) const {
 void kyoskNew::drawCells() {
     const unsigned drawing = ++m_drawing;
     drawDrafts();
+    if (drawing != m_drawing)
+        return;
     for (int first = 0; first < List2.count(); first += drawnAtOnce) {
         const int behind = std::min(first + drawnAtOnce, List2.count());
         std::vector<HostPath> paths;
@@ -182,9 +184,11 @@ void kyoskNew::drawCells() {
             // A file that can't be read leaves its cell empty, and the page goes on.
             CellPicture& shown = Picture1[static_cast<std::size_t>(cell)];
             Result<Bitmap>& picture = pictures[static_cast<std::size_t>(cell - first)];
-            if (!picture && !m_door->isWaiting(m_choice.path(cell)))
+            const bool waiting = m_door->isWaiting(m_choice.path(cell)); // its draft stays
+            if (!picture && !waiting)
                 m_door->foundUnreadable(m_choice.path(cell));
-            shown.bitmap = picture ? std::move(*picture) : Bitmap();
+            if (picture || !waiting)
+                shown.bitmap = picture ? std::move(*picture) : Bitmap();
             shown.visible = true;
             m_resolution.look(m_choice.path(cell));
             showCell(cell);
@@ -233,8 +237,9 @@ void kyoskNew::repaint(const QString& path) {
         if (List2.item(cell) != path)
             continue;
         std::vector<Result<Bitmap>> pictures = m_small.load({hostOf(pictureToDraw(path))}, m_cellPixels);
-        if (pictures.front())
-            Picture1[static_cast<std::size_t>(cell)].bitmap = std::move(*pictures.front());
+        if (pictures.front() || m_door->isUnreadable(path))
+            Picture1[static_cast<std::size_t>(cell)].bitmap =
+                pictures.front() ? std::move(*pictures.front()) : Bitmap();
     }
     Q_EMIT changed();
 }
