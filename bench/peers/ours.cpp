@@ -1,6 +1,7 @@
-// ours paper KERNELS FOLDER FILE... | ours floor - FOLDER FILE... | ours small THREADS FOLDER FILE... | ours drafts -
-// FOLDER FILE... ours idle - - - ours planes - FOLDER FILE... makes what floor reads. KERNELS is "best" or a name of
-// allKernels. "floor" decodes to planes and encodes planes of the print's size, no scaling between.
+// ours MODE VARIANT FOLDER FILE... does to the files what MODE says and writes into FOLDER.
+// paper KERNELS: KERNELS is "best" or a name of allKernels. floor -: decodes to planes and encodes planes of the
+// print's size, no scaling between. planes -: makes what floor reads. small THREADS, drafts -: pictures of cells. idle
+// -: nothing, without files.
 
 #include "Floor.h"
 #include "door/PictureDraft.h"

@@ -74,6 +74,10 @@ QString decode(const QByteArray& bytes) {
     return text;
 }
 
+bool holds(const QString& text) {
+    return !squeeze(text).contains(u'?');
+}
+
 QString squeeze(const QString& text) {
     return decode(encode(text));
 }

@@ -17,4 +17,7 @@ QString decode(const QByteArray& bytes);
 // The text with "?" in place of each character that the code page lacks.
 QString squeeze(const QString& text);
 
+// squeeze() leaves no "?" in it.
+bool holds(const QString& text);
+
 } // namespace lumora::AnsiCodePage

@@ -10,7 +10,6 @@
 #include <array>
 #include <cerrno>
 #include <chrono>
-#include <climits>
 #include <string>
 #include <utility>
 
@@ -92,6 +91,8 @@ Descriptor above(int number) {
     return Descriptor(::fcntl(number, F_DUPFD_CLOEXEC, doorTargetNumber + 1));
 }
 
+constexpr qint64 betweenLooks = 100; // milliseconds, for a stop
+
 // A child, killed at the latest when this goes.
 class Child {
 public:
@@ -138,8 +139,9 @@ public:
         return error;
     }
 
-    // Waits for the end. Gives an errno, ETIMEDOUT when the time is over, or 0 and the status that waitpid tells.
-    int ended(int seconds, int& status) {
+    // Waits for the end. Gives an errno, ETIMEDOUT when the time is over, ECANCELED at a stop, or 0 and the status that
+    // waitpid tells.
+    int ended(int seconds, const std::stop_token& stop, int& status) {
         using namespace std::chrono;
         const Descriptor process(static_cast<int>(::syscall(SYS_pidfd_open, m_id, 0)));
         if (!process.valid())
@@ -149,8 +151,10 @@ public:
             const auto left = ceil<milliseconds>(end - steady_clock::now()).count();
             if (left <= 0)
                 return ETIMEDOUT;
+            if (stop.stop_requested())
+                return ECANCELED;
             pollfd waited{process.number(), POLLIN, 0};
-            const int ready = ::poll(&waited, 1, static_cast<int>(std::min<qint64>(left, INT_MAX)));
+            const int ready = ::poll(&waited, 1, static_cast<int>(std::min<qint64>(left, betweenLooks)));
             if (ready > 0)
                 return reap(status);
             if (ready < 0 && errno != EINTR)
@@ -227,13 +231,13 @@ struct Decoded {
 };
 
 Result<Decoded> decoded(const std::filesystem::path& program, const DoorLimits& limits, const Descriptor& file,
-                        const std::filesystem::path& source) {
+                        const std::filesystem::path& source, const std::stop_token& stop) {
     Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
     Child child;
     if (const int error = made.valid() ? child.start(program, limits, file.number(), made.number()) : errno; error != 0)
         return Failure{Failure::Kind::Other, fileFailure(program, u"can't be started"_s, error).message};
     int status = 0;
-    const int error = child.ended(limits.seconds, status);
+    const int error = child.ended(limits.seconds, stop, status);
     if (error == ETIMEDOUT)
         return takesTooLong(source);
     if (error != 0)
@@ -260,8 +264,8 @@ Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source, DoorRu
     return header ? lumora::needOf(*header, *file, source, rules) : header.failure();
 }
 
-Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
-                                            const std::filesystem::path& target) const {
+Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source, const std::filesystem::path& target,
+                                            const std::stop_token& stop) const {
     const auto file = openSource(source, shownPath(source));
     const auto header = file ? headerOf(*file, source) : file.failure();
     if (!header)
@@ -270,8 +274,8 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     if (!need)
         return need.failure();
     const bool copied = *need == DoorNeed::Nothing || *need == DoorNeed::Copy;
-    auto picture =
-        copied ? Decoded{Descriptor(), coloursOf(*header).profileIgnored} : decoded(m_program, m_limits, *file, source);
+    auto picture = copied ? Decoded{Descriptor(), coloursOf(*header).profileIgnored}
+                          : decoded(m_program, m_limits, *file, source, stop);
     if (!picture)
         return picture.failure();
     NewContent content(target, shownPath(target));

@@ -5,6 +5,7 @@
 #include "door/DoorNeed.h"
 
 #include <filesystem>
+#include <stop_token>
 
 namespace lumora {
 
@@ -23,8 +24,9 @@ public:
         bool profileIgnored = false; // the colour profile is broken, so that the colours were taken as sRGB
     };
     // The target holds the whole new picture, or what it held before: Damaged, TooLarge, TimedOut and Unsupported are
-    // the picture's failures, NoSpace and others the disk's.
-    Result<Made> make(const std::filesystem::path& source, const std::filesystem::path& target) const;
+    // the picture's failures, NoSpace and others the disk's. A stop ends the child.
+    Result<Made> make(const std::filesystem::path& source, const std::filesystem::path& target,
+                      const std::stop_token& stop = {}) const;
 
 private:
     std::filesystem::path m_program;

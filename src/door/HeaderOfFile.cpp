@@ -35,4 +35,9 @@ Result<PictureHeader> headerOf(const Descriptor& file, const std::filesystem::pa
     return header;
 }
 
+Result<PictureHeader> headerOf(const std::filesystem::path& path) {
+    const auto file = openSource(path, shownPath(path));
+    return file ? headerOf(*file, path) : file.failure();
+}
+
 } // namespace lumora

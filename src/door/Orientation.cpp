@@ -1,17 +1,10 @@
 #include "door/Orientation.h"
 
-#include "door/HeaderOfFile.h"
 #include "imaging/drawing/Drawing.h"
 
 #include <utility>
 
 namespace lumora {
-
-int orientationOf(const std::filesystem::path& path) {
-    const auto file = openSource(path, {});
-    const auto header = file ? headerOf(*file, path) : file.failure();
-    return header ? header->orientation : 1;
-}
 
 Bitmap upright(Bitmap picture, int orientation) {
     if (orientation == 2 || orientation == 7)

@@ -4,7 +4,9 @@
 #include "order/OrderState.h"
 #include "session/Workspace.h"
 
+#include <QRegularExpression>
 #include <QSet>
+#include <QUuid>
 
 namespace lumora {
 
@@ -16,40 +18,29 @@ DrivePath doorFolders(const Files& files) {
     return files.drives().programRoot() / u"2000lumora\\zmany\\door";
 }
 
-// The folders within this one to which the lines' paths lead. A customer's card may hold a copy of a workspace, so that
-// the drive counts too.
-QSet<QString> foldersOf(const QStringList& lines, const DrivePath& all) {
-    const QString before = all.text() + u'\\';
+// The folders of orders to which the lines' paths lead. A customer's card may hold a copy of a workspace, so that the
+// drive counts too.
+QSet<QString> foldersOf(const QStringList& lines, const Files& files) {
+    static const QRegularExpression name(u"^[0-9a-f]{12}(?=\\\\)"_s);
+    const QString before = doorFolders(files).text() + u'\\';
     QSet<QString> folders;
     for (const QString& line : lines) {
         const qsizetype at = line.indexOf(before);
-        const qsizetype end = at < 0 ? -1 : line.indexOf(u'\\', at + before.size());
-        if (end >= 0)
-            folders += line.mid(at, end - at);
+        const QString found = at < 0 ? QString() : name.match(line.mid(at + before.size())).captured();
+        if (!found.isEmpty())
+            folders += before + found;
     }
     return folders;
 }
 
 } // namespace
 
-Result<DrivePath> makeDoorFolder(const SessionState& state, const Files& files) {
-    const DrivePath all = doorFolders(files);
-    for (const DrivePath& above : {WorkspacePaths::root(state), WorkspacePaths::zmany(state), all}) {
-        if (const Result<void> made = files.makeFolder(above); !made)
-            return made.failure();
-    }
-    for (int number = 1;; ++number) {
-        const DrivePath folder = all / QString::number(number);
-        const Result<bool> made = files.makeNewFolder(folder);
-        if (!made)
-            return made.failure();
-        if (*made)
-            return folder;
-    }
+DrivePath newDoorFolder(const Files& files) {
+    return doorFolders(files) / QUuid::createUuid().toString(QUuid::Id128).left(12);
 }
 
 void removeDoorFolders(const Files& files, const QStringList& lines) {
-    for (const QString& folder : foldersOf(lines, doorFolders(files)))
+    for (const QString& folder : foldersOf(lines, files))
         static_cast<void>(files.removeTree(DrivePath(folder))); // the next start tries again
 }
 
@@ -65,7 +56,7 @@ void tidyDoorFolders(const SessionState& state, const Files& files) {
         const bool leaves = order && order->way != OrderState::Way::Station && order->way != OrderState::Way::Mail;
         if (order &&
             (order->phase == OrderState::Phase::Preparing || (leaves && order->phase < OrderState::Phase::Sending)))
-            needed += foldersOf(order->items, all);
+            needed += foldersOf(order->items, files);
     }
     for (const QString& number : numbers) {
         if (const DrivePath folder = all / number; !needed.contains(folder.text()))

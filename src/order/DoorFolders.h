@@ -12,8 +12,9 @@ struct SessionState;
 // The folders of zmany\door: what was made of an order's pictures that are no ordinary JPEG files. The lines of its
 // basket lead there, so that a folder stays as long as its order may still be prepared.
 
-// An empty folder for the order that begins.
-Result<DrivePath> makeDoorFolder(const SessionState& state, const Files& files);
+// The folder of an order that begins; it is made with the first of its pictures. No two orders ever get one name, since
+// an order that was sent long ago still has the lines that led to its own.
+DrivePath newDoorFolder(const Files& files);
 
 // The way back of an order with these lines is closed.
 void removeDoorFolders(const Files& files, const QStringList& lines);

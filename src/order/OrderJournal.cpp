@@ -117,13 +117,15 @@ Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
     if (next.way == Way::Station || next.way == Way::Mail)
         next.way = wayOf(by);
     next.folderMadeByUs = next.folderMadeByUs || (ours && next.way == wayOf(by));
+    const bool isFirst = m_state.phase < Phase::Sending;
     const Result<void> kept = keep(next);
     if (kept) {
         const DrivePath aside = m_folder.keptWorkPath();
         if (m_files.folderExists(aside))
             static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
-        removeDoorFolders(m_files, m_state.items);
     }
+    if (kept && isFirst)
+        removeDoorFolders(m_files, m_state.items);
     return kept;
 }
 

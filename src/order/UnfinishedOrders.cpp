@@ -260,7 +260,7 @@ bool GoOnWithOrder(const UnfinishedOrder& order, SessionState& state, const File
 Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder) {
     const Result<OrderState> order = ReadOrderState(files, folder);
     Result<void> removed = files.removeTree(folder.path());
-    if (removed && order)
+    if (removed && order && order->phase < Phase::Sending)
         removeDoorFolders(files, order->items);
     return removed;
 }

@@ -25,7 +25,6 @@ bool SmallPictures::keeps(const HostPath& path, int cell) const {
 }
 
 std::vector<Result<Bitmap>> SmallPictures::load(const std::vector<HostPath>& paths, int cell) {
-    m_reader.request_stop();
     std::vector<QString> keys;
     std::vector<HostPath> unknown;
     std::vector<std::optional<Result<Bitmap>>> found(paths.size());

@@ -22,8 +22,9 @@ public:
     std::vector<Result<Bitmap>> load(const std::vector<HostPath>& paths, int cell);
     bool keeps(const HostPath& path, int cell) const;
 
-    // Reads these in the background, one after the other, until something is loaded or others are to be read.
+    // Reads these in the background, one after the other.
     void readAhead(const std::vector<HostPath>& paths, int cell);
+    void stopReadingAhead() { m_reader.request_stop(); }
 
 private:
     static QString keyOf(const HostPath& path, int cell);

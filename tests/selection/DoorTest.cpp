@@ -3,6 +3,7 @@
 #include "imaging/files/PictureFile.h"
 #include "order/DoorFolders.h"
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "order/OrderState.h"
 #include "samples/SamplePhotographs.h"
 #include "samples/SamplePictureFiles.h"
@@ -14,6 +15,7 @@
 #include <QElapsedTimer>
 #include <QFile>
 #include <QGuiApplication>
+#include <QSet>
 
 #include <gtest/gtest.h>
 
@@ -35,7 +37,7 @@ TEST(DoorNames, AreInTheCodePageAndThereOnce) {
         EXPECT_EQ(doorNames(row.names), row.behind) << qPrintable(row.names.join(u' '));
 }
 
-const QString doorFolder = u"C:\\2000lumora\\zmany\\door\\1"_s;
+const QString doorFolders = u"C:\\2000lumora\\zmany\\door"_s;
 
 class TheDoor : public testing::Test, protected PageRig {
 protected:
@@ -85,10 +87,8 @@ protected:
             return std::none_of(cells.begin(), cells.end(), [](const CellPicture& cell) { return cell.waiting; });
         });
     }
-    QStringList made() const {
-        return machine.files.collect(DrivePath(doorFolder), Files::Depth::WithSubfolders)
-            .replaceInStrings(doorFolder, QString());
-    }
+    QStringList made() const { return machine.files.collect(DrivePath(doorFolders), Files::Depth::WithSubfolders); }
+    QStringList folders() const { return machine.files.folders(DrivePath(doorFolders)); }
 
     const QImage picture = patches(48, 32);
 };
@@ -100,7 +100,7 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     EXPECT_TRUE(shown.Picture1[3].waiting) << "its turn comes while the customer looks";
     for (const std::size_t draft : {1, 4})
         EXPECT_GT(shown.Picture1[draft].bitmap.height(), shown.Picture1[draft].bitmap.width()) << draft;
-    EXPECT_EQ(shown.Picture1[5].unreadable, u"unknown kind of file"_s) << "told by its header";
+    EXPECT_EQ(shown.Picture1[5].unreadable, u"a kind of file that can't be shown"_s) << "told by its header";
     waitForCells(page);
     const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.jpg"_s, u"g.webp"_s};
     for (std::size_t cell = 0; cell < 6; ++cell) {
@@ -138,7 +138,7 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     EXPECT_EQ(again.controls().Label7.text, u"4"_s);
     EXPECT_EQ(again.controls().Picture1[3].name + again.controls().Label4[3].text, u"d.heic1"_s);
     chain.unload(PageId::kyoskNew);
-    waitUntil([this] { return !machine.files.folderExists(DrivePath(doorFolder)); });
+    waitUntil([this] { return folders().isEmpty(); });
 }
 
 TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
@@ -152,8 +152,10 @@ TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
     EXPECT_FALSE(page.controls().doorPanel.visible);
     page.Image7_Click();
     EXPECT_TRUE(page.controls().doorCount.text.endsWith(u" / 19"_s));
-    waitUntil([&page] { return page.controls().Frame4.visible; });
-    EXPECT_FALSE(page.controls().doorPanel.visible);
+    waitUntil([&page] { return !page.controls().doorPanel.visible; });
+    EXPECT_FALSE(page.controls().Frame4.visible) << "the box is read first";
+    page.Image7_Click();
+    EXPECT_TRUE(page.controls().Frame4.visible);
     EXPECT_EQ(page.controls().Label20.text, u"17"_s);
     EXPECT_EQ(machine.dialogs.messages,
               QStringList(u"These pictures can't be read and were taken out of the order:\ne.jpg\nz13.png"_s));
@@ -221,40 +223,65 @@ TEST_F(TheDoor, OffersAndUsesJpegFilesAsTheyLieUnlessTheLabAsksForMore) {
     kyoskNew& asBuiltIn = openWithTheFolder();
     EXPECT_EQ(asBuiltIn.controls().List2.items(),
               QStringList({u"C:\\p\\a.jpg"_s, u"C:\\p\\b.jpg"_s, u"C:\\p\\caf?.jpg"_s, u"C:\\p\\e.jpg"_s}));
-    EXPECT_FALSE(machine.files.folderExists(DrivePath(doorFolder)));
+    EXPECT_TRUE(folders().isEmpty());
     chain.unload(PageId::kyoskNew);
     state.door.upright = true;
     put(u"a.jpg"_s, jpegWith(saved(picture, "JPG"), {}, adobeProfile()));
     kyoskNew& upright = openWithTheFolder();
     const QStringList paths = upright.controls().List2.items();
     EXPECT_EQ(paths.first(), u"C:\\p\\a.jpg"_s) << "its colours are as stored";
-    EXPECT_TRUE(paths.value(1).startsWith(doorFolder) && paths.size() == 4);
+    EXPECT_TRUE(paths.value(1).startsWith(doorFolders) && paths.size() == 4);
 }
 
 TEST_F(TheDoor, KeepsTheFoldersOfOrdersThatMayStillBePreparedAndNoOther) {
-    for (int i = 1; i <= 4; ++i) {
-        const auto folder = makeDoorFolder(state, machine.files);
-        ASSERT_TRUE(folder);
-        EXPECT_EQ(folder->leaf(), QString::number(i));
-        write(*folder / u"x.jpg", "x");
-    }
-    makeFolder(u"C:\\2000lumora\\!!000\\a"_path);
-    const auto keep = [this](OrderState::Phase phase, OrderState::Way way) {
-        OrderState order;
-        order.number = u"7"_s;
-        order.phase = phase;
-        order.way = way;
-        order.items = {u"1 1015GNBC:\\2000lumora\\zmany\\door\\2\\k\\a.jpg"_s,
-                       u"1 1015GNBZ:\\card\\2000lumora\\zmany\\door\\4\\k\\a.jpg"_s};
-        EXPECT_TRUE(WriteOrderState(machine.files, OrderFolder(u"C:\\2000lumora\\!!000\\a"_path), order));
-        tidyDoorFolders(state, machine.files);
-        return machine.files.folders(u"C:\\2000lumora\\zmany\\door"_path);
+    const auto make = [this] {
+        const DrivePath folder = newDoorFolder(machine.files);
+        makeFolder(folder);
+        write(folder / u"x.jpg", "x");
+        return folder;
     };
-    EXPECT_EQ(keep(OrderState::Phase::Preparing, OrderState::Way::Station), QStringList(u"2"_s));
-    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Ftp), QStringList(u"2"_s));
-    removeDoorFolders(machine.files, {u"1 1015GNBD:\\2000lumora\\zmany\\door\\2\\k\\a.jpg"_s});
-    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Ftp), QStringList(u"2"_s)) << "a customer's card";
+    const DrivePath own = make();
+    const DrivePath other = make();
+    const OrderFolder order(u"C:\\2000lumora\\!!000\\a"_path);
+    makeFolder(order.path());
+    const QStringList lines{u"1 1015GNB"_s + own.text() + u"\\k\\a.jpg"_s,
+                            u"1 1015GNBD:"_s + other.text().mid(2) + u"\\k\\a.jpg"_s}; // of a customer's card
+    const auto keep = [&](OrderState::Phase phase, OrderState::Way way) {
+        OrderState kept;
+        kept.number = u"7"_s;
+        kept.phase = phase;
+        kept.way = way;
+        kept.items = lines;
+        EXPECT_TRUE(WriteOrderState(machine.files, order, kept));
+        tidyDoorFolders(state, machine.files);
+        return folders();
+    };
+    EXPECT_EQ(keep(OrderState::Phase::Preparing, OrderState::Way::Station), QStringList(own.leaf()));
+    EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Ftp), QStringList(own.leaf()));
+    // Its folder goes with the first sending; what lies there at a later one is not its own.
+    OrderJournal journal(machine.files, order);
+    EXPECT_TRUE(journal.sendingBegins(Sender::Ftp, true));
+    EXPECT_TRUE(folders().isEmpty());
+    makeFolder(own);
+    EXPECT_TRUE(journal.sendingBegins(Sender::Ftp, true));
+    EXPECT_EQ(folders(), QStringList(own.leaf()));
     EXPECT_EQ(keep(OrderState::Phase::Prepared, OrderState::Way::Station), QStringList());
+}
+
+TEST_F(TheDoor, NeverTakesOnePictureForAnother) {
+    kyoskNew& page = openWithTheFolder();
+    waitForCells(page);
+    const QStringList first = page.controls().List2.items();
+    // Another card lies at the same place by now, and a file more.
+    put(u"d.heic"_s, heif(patches(32, 48), {}));
+    put(u"d.avif"_s, heif(picture, {.avif = true}));
+    machine.dialogs.picks += u"C:\\p\\a.jpg"_path;
+    page.Image5_Click();
+    waitForCells(page);
+    const QStringList second = page.controls().List2.items().sliced(1); // behind the last of the first time
+    EXPECT_EQ(QSet<QString>(second.begin(), second.end()).size(), second.size());
+    EXPECT_FALSE(second.contains(first[3])) << "the first card's";
+    EXPECT_TRUE(machine.files.fileExists(DrivePath(first[3])));
 }
 
 } // namespace

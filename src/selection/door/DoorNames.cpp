@@ -1,7 +1,6 @@
 #include "selection/door/DoorNames.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/FixedText.h"
 
 #include <QSet>
 
@@ -11,12 +10,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-bool isInCodePage(const QString& text) {
-    return !HasQuestionMark(AnsiCodePage::squeeze(text));
-}
-
 bool keepsItsName(const QString& name) {
-    return (name.endsWith(u".jpg"_s) || name.endsWith(u".JPG"_s)) && isInCodePage(name);
+    return (name.endsWith(u".jpg"_s) || name.endsWith(u".JPG"_s)) && AnsiCodePage::holds(name);
 }
 
 QString stemOf(const QString& name) {
@@ -29,9 +24,9 @@ QString inCodePage(const QString& text) {
     const QString whole = text.normalized(QString::NormalizationForm_C);
     for (const QChar letter : whole) {
         const QString plain =
-            isInCodePage(letter) ? QString(letter) : QString(letter).normalized(QString::NormalizationForm_D);
+            AnsiCodePage::holds(letter) ? QString(letter) : QString(letter).normalized(QString::NormalizationForm_D);
         for (const QChar part : plain) {
-            if (isInCodePage(part) && !u"<>:\"/\\|*?"_s.contains(part) && part.isPrint())
+            if (AnsiCodePage::holds(part) && !u"<>:\"/\\|*?"_s.contains(part) && part.isPrint())
                 kept += part;
         }
     }
@@ -48,18 +43,20 @@ QStringList doorNames(const QStringList& names) {
     }
     QStringList result;
     for (const QString& name : names) {
-        if (keepsItsName(name)) {
-            result += name;
-            continue;
-        }
-        const QString own = inCodePage(stemOf(name));
-        QString made = own.isEmpty() ? u"picture 1.jpg"_s : own + u".jpg"_s;
-        for (int number = 2; taken.contains(made.toCaseFolded()); ++number)
-            made = own.isEmpty() ? u"picture %1.jpg"_s.arg(number) : own + u" (%1).jpg"_s.arg(number);
-        taken += made.toCaseFolded();
-        result += made;
+        result += keepsItsName(name)
+                      ? name
+                      : freeDoorName(name, [&](const QString& made) { return taken.contains(made.toCaseFolded()); });
+        taken += result.last().toCaseFolded();
     }
     return result;
+}
+
+QString freeDoorName(const QString& name, const std::function<bool(const QString&)>& isTaken) {
+    const QString own = inCodePage(stemOf(name));
+    QString made = own.isEmpty() ? u"picture 1.jpg"_s : own + u".jpg"_s;
+    for (int number = 2; isTaken(made); ++number)
+        made = own.isEmpty() ? u"picture %1.jpg"_s.arg(number) : own + u" (%1).jpg"_s.arg(number);
+    return made;
 }
 
 } // namespace lumora

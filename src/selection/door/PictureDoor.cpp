@@ -1,13 +1,13 @@
 #include "selection/door/PictureDoor.h"
 
 #include "common/AnsiCodePage.h"
-#include "common/FixedText.h"
 #include "common/PictureName.h"
 #include "door/PictureDraft.h"
 #include "platform/files/Files.h"
 #include "selection/door/DoorNames.h"
 
 #include <QCryptographicHash>
+#include <QSet>
 #include <QThreadPool>
 
 #include <algorithm>
@@ -23,35 +23,29 @@ namespace {
 constexpr int madeAtOnce = 2;
 constexpr qint64 room = qint64(2) << 30;
 
-bool isInCodePage(const QString& path) {
-    return !HasQuestionMark(AnsiCodePage::squeeze(path));
-}
-
 // Folders of one name on two cards get two folders here.
 QString keyOf(const HostPath& folder) {
     const QByteArray path = QByteArray::fromStdString(folder.native());
     return QString::fromLatin1(QCryptographicHash::hash(path, QCryptographicHash::Sha1).toHex().left(8));
 }
 
-bool isThePictures(Failure::Kind kind) {
+bool isThePictures(const Failure& failure) {
     using Kind = Failure::Kind;
-    return kind == Kind::Damaged || kind == Kind::TooLarge || kind == Kind::TimedOut || kind == Kind::Unsupported ||
-           kind == Kind::NotFound;
+    return failure.kind == Kind::Damaged || failure.kind == Kind::TooLarge || failure.kind == Kind::TimedOut ||
+           failure.kind == Kind::Unsupported;
 }
 
-// The time of the customer's file, by which a picture that was made of another one is told.
-bool isOfTheTime(const HostPath& made, const HostPath& source) {
-    std::error_code none;
-    const auto time = std::filesystem::last_write_time(made, none);
-    return !none && time == std::filesystem::last_write_time(source, none) && !none;
-}
-
-Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, const HostPath& target) {
-    const Result<DoorDecoder::Made> made = decoder.make(source, target);
+// Gives the bytes of the made file. It gets the time of the customer's, by which it is known again.
+Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, const HostPath& target,
+                           const std::stop_token& stop) {
+    std::error_code untold;
+    const auto time = std::filesystem::last_write_time(source, untold);
+    const Result<DoorDecoder::Made> made = decoder.make(source, target, stop);
     if (!made)
         return made.failure();
-    std::error_code passedOver; // without the time the file is made once more at the next need
-    std::filesystem::last_write_time(target, std::filesystem::last_write_time(source, passedOver), passedOver);
+    std::error_code passedOver;
+    if (!untold && std::filesystem::last_write_time(source, passedOver) == time)
+        std::filesystem::last_write_time(target, time, passedOver);
     const auto bytes = std::filesystem::file_size(target, passedOver);
     return passedOver ? 0 : static_cast<qint64>(bytes);
 }
@@ -79,6 +73,7 @@ PictureDoor::PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rule
 }
 
 PictureDoor::~PictureDoor() {
+    m_stop.request_stop();
     const std::lock_guard lock(m_desk->mutex);
     m_desk->door = nullptr;
 }
@@ -91,7 +86,21 @@ const PictureDoor::Picture* PictureDoor::find(const QString& worked) const {
     return m_byWorked.value(worked);
 }
 
-DrivePath PictureDoor::planned(const DrivePath& listed) {
+PictureDoor::FileStamp PictureDoor::stampOf(const HostPath& path) {
+    std::error_code none;
+    const FileStamp stamp{std::filesystem::file_size(path, none), std::filesystem::last_write_time(path, none)};
+    return none ? FileStamp() : stamp;
+}
+
+// No other picture has the path, and what lies there was made of this one.
+bool PictureDoor::isFree(const DrivePath& made, const HostPath& source) const {
+    const HostPath file = m_files.drives().toHost(made).value_or(HostPath());
+    std::error_code none;
+    return !m_byWorked.contains(made.text()) &&
+           (!std::filesystem::exists(file, none) || stampOf(file).time == stampOf(source).time);
+}
+
+QString PictureDoor::planned(const DrivePath& listed, const HostPath& source) {
     const DrivePath folder = listed.folder();
     QHash<QString, QString>& names = m_names[folder.text()];
     if (!names.contains(listed.leaf())) {
@@ -103,8 +112,12 @@ DrivePath PictureDoor::planned(const DrivePath& listed) {
                 names[all[i]] = behind[i];
         }
     }
-    const HostPath host = m_files.drives().toHost(folder).value_or(HostPath());
-    return m_folder / keyOf(host) / names.value(listed.leaf(), doorNames({listed.leaf()}).first());
+    const DrivePath made = m_folder / keyOf(source.parent_path());
+    const QString name = names.value(listed.leaf());
+    if (!name.isEmpty() && isFree(made / name, source))
+        return (made / name).text();
+    return (made / freeDoorName(listed.leaf(), [&](const QString& next) { return !isFree(made / next, source); }))
+        .text();
 }
 
 PictureDoor::Picture& PictureDoor::enter(const QString& listed) {
@@ -112,41 +125,43 @@ PictureDoor::Picture& PictureDoor::enter(const QString& listed) {
     const DrivePath path(listed);
     picture.listed = listed;
     picture.source = m_files.drives().toHost(path).value_or(HostPath());
-    const bool inCodePage = isInCodePage(listed);
-    judge(picture, inCodePage);
-    picture.worked = picture.state == State::InPlace || (picture.state == State::Unreadable && inCodePage)
-                         ? listed
-                         : planned(path).text();
-    if (picture.state == State::Waiting) {
-        const HostPath made = m_files.drives().toHost(DrivePath(picture.worked)).value_or(HostPath());
-        if (isOfTheTime(made, picture.source))
-            picture.state = State::Ready;
-    }
+    picture.stamp = stampOf(picture.source);
+    judge(picture);
+    picture.worked =
+        picture.state == State::InPlace || picture.state == State::Unreadable ? listed : planned(path, picture.source);
+    if (picture.state == State::Waiting &&
+        stampOf(m_files.drives().toHost(DrivePath(picture.worked)).value_or(HostPath())).time == picture.stamp.time)
+        picture.state = State::Ready;
     m_byListed[listed] = m_byWorked[picture.worked] = &picture;
     return picture;
 }
 
-void PictureDoor::judge(Picture& picture, bool inCodePage) {
+void PictureDoor::judge(Picture& picture) {
     const Result<DoorNeed> need = DoorDecoder::needOf(picture.source, m_rules);
-    if (!need) {
-        picture.failure = need.failure();
-        picture.state = m_rules.everyFormat ? State::Unreadable : State::InPlace;
-    } else {
-        picture.state = *need == DoorNeed::Nothing && inCodePage ? State::InPlace : State::Waiting;
+    if (need) {
+        const bool stays = *need == DoorNeed::Nothing && AnsiCodePage::holds(picture.listed);
+        picture.state = stays ? State::InPlace : State::Waiting;
+        return;
     }
+    picture.failure = need.failure();
+    picture.state = !m_rules.everyFormat            ? State::InPlace
+                    : isThePictures(need.failure()) ? State::Unreadable
+                                                    : State::NotMade;
 }
 
 QString PictureDoor::worked(const QString& listed) {
-    if (!isOpen() || listed.isEmpty() || m_byWorked.contains(listed) || listed.startsWith(m_folder.text() + u'\\'))
+    if (!isOpen() || listed.isEmpty() || listed.startsWith(m_folder.text() + u'\\'))
         return listed;
-    if (const Picture* known = m_byListed.value(listed))
-        return known->worked;
-    return enter(listed).worked;
+    const Picture* known = m_byListed.value(listed);
+    return known && stampOf(known->source) == known->stamp ? known->worked : enter(listed).worked;
 }
 
 QString PictureDoor::shown(const QString& worked) const {
     const Picture* picture = find(worked);
-    return picture ? picture->listed : worked;
+    if (picture)
+        return picture->listed;
+    // Of an order that was begun by another run the name alone is known.
+    return isOpen() && worked.startsWith(m_folder.text() + u'\\') ? LeafName(worked) : worked;
 }
 
 PictureDoor::State PictureDoor::stateOf(const QString& worked) const {
@@ -165,22 +180,25 @@ Bitmap PictureDoor::draft(const QString& worked, int cell) const {
     return pictureDraft(source, cell, m_rules.upright ? Held::Upright : Held::AsStored);
 }
 
-void PictureDoor::foundUnreadable(const QString& worked) {
+void PictureDoor::foundUnreadable(const QString& worked, const Failure& why) {
     Picture* picture = find(worked);
-    if (!picture || !m_rules.everyFormat || picture->state == State::Unreadable)
+    if (!picture || picture->state != State::InPlace || !m_rules.everyFormat || !isThePictures(why))
         return;
     picture->state = State::Unreadable;
-    picture->failure = {Failure::Kind::Damaged, shown(worked)};
+    picture->failure = why;
 }
 
 void PictureDoor::want(const QStringList& worked) {
     m_wanted.clear();
+    QSet<QString> taken;
     for (const QString& path : worked) {
         Picture* picture = find(path);
         if (picture && picture->state == State::NotMade)
             picture->state = State::Waiting;
-        if (picture && picture->state == State::Waiting && !picture->inHand && !m_wanted.contains(path))
-            m_wanted += path;
+        if (!picture || picture->state != State::Waiting || picture->inHand || taken.contains(path))
+            continue;
+        taken += path;
+        m_wanted += path;
     }
     startNext();
 }
@@ -197,16 +215,27 @@ void PictureDoor::start(Picture& picture) {
     const DrivePath path(picture.worked);
     picture.inHand = true;
     ++m_running;
-    const Result<void> ready = m_files.makeFolder(path.folder());
-    const Result<HostPath> target = ready ? m_files.host(path) : ready.failure();
-    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = picture.source, target] {
-        const Result<qint64> made = target ? makePicture(decoder, source, *target) : target.failure();
+    const Result<HostPath> target = targetOf(path);
+    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = picture.source, target,
+                      stop = m_stop.get_token()] {
+        const Result<qint64> made = target ? makePicture(decoder, source, *target, stop) : target.failure();
         const std::lock_guard lock(desk->mutex);
         PictureDoor* door = desk->door;
         if (door)
             QMetaObject::invokeMethod(
                 door, [door, worked, made] { door->settle(worked, made); }, Qt::QueuedConnection);
     });
+}
+
+// A folder that can't be made is no fault of the picture.
+Result<HostPath> PictureDoor::targetOf(const DrivePath& made) const {
+    for (const DrivePath& folder : {m_folder.folder(), m_folder, made.folder()}) {
+        if (const Result<void> there = m_files.makeFolder(folder); !there)
+            return Failure{there.failure().kind == Failure::Kind::NoSpace ? Failure::Kind::NoSpace
+                                                                          : Failure::Kind::Other,
+                           there.failure().message};
+    }
+    return m_files.host(made);
 }
 
 void PictureDoor::settle(const QString& worked, const Result<qint64>& made) {
@@ -220,7 +249,7 @@ void PictureDoor::settle(const QString& worked, const Result<qint64>& made) {
         makeRoom();
     } else {
         picture.failure = made.failure();
-        picture.state = isThePictures(made.failure().kind) ? State::Unreadable : State::NotMade;
+        picture.state = isThePictures(made.failure()) ? State::Unreadable : State::NotMade;
     }
     startNext();
     Q_EMIT settled(worked);

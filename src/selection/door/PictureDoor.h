@@ -11,9 +11,11 @@
 #include <QObject>
 #include <QStringList>
 
+#include <cstdint>
 #include <deque>
 #include <functional>
 #include <memory>
+#include <stop_token>
 #include <utility>
 
 namespace lumora {
@@ -31,7 +33,7 @@ public:
         Waiting,    // not made yet
         Ready,      // made
         Unreadable, // no picture, or a damaged one
-        NotMade,    // the disk did not take it; it is tried again when it is wanted again
+        NotMade,    // the disk did not take it, or the file is not there; tried again when it is wanted again
     };
 
     PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rules);
@@ -58,9 +60,9 @@ public:
     Bitmap draft(const QString& worked, int cell) const;
     // Why a file is unreadable or was not made.
     Failure failureOf(const QString& worked) const;
-    // A file that was used in its place can't be shown. Only where all kinds of pictures are offered; as built in such
+    // A file that is used in its place can't be shown. Only where all kinds of pictures are offered; as built in such
     // a file can be chosen.
-    void foundUnreadable(const QString& worked);
+    void foundUnreadable(const QString& worked, const Failure& why);
 
     // What is waiting among these is made in this order, and nothing else any more.
     void want(const QStringList& worked);
@@ -73,10 +75,18 @@ Q_SIGNALS:
     void settled(const QString& worked);
 
 private:
+    // Another card may lie at the same path by now.
+    struct FileStamp {
+        std::uintmax_t length = 0;
+        std::filesystem::file_time_type time;
+        bool operator==(const FileStamp&) const = default;
+    };
+    static FileStamp stampOf(const HostPath& path);
     struct Picture {
         QString listed;
         QString worked;
         HostPath source;
+        FileStamp stamp; // of the source, when it was looked at
         State state = State::InPlace;
         Failure failure;
         qint64 bytes = 0;
@@ -87,10 +97,12 @@ private:
     Picture* find(const QString& worked);
     const Picture* find(const QString& worked) const;
     Picture& enter(const QString& listed);
-    DrivePath planned(const DrivePath& listed);
-    void judge(Picture& picture, bool inCodePage);
+    QString planned(const DrivePath& listed, const HostPath& source);
+    bool isFree(const DrivePath& made, const HostPath& source) const;
+    void judge(Picture& picture);
     void startNext();
     void start(Picture& picture);
+    Result<HostPath> targetOf(const DrivePath& made) const;
     void settle(const QString& worked, const Result<qint64>& made);
     void makeRoom();
 
@@ -106,6 +118,7 @@ private:
     QStringList m_made; // the oldest first
     std::function<bool(const QString&)> m_isKept;
     int m_running = 0;
+    std::stop_source m_stop; // of what is being made
     std::shared_ptr<Desk> m_desk;
 };
 

@@ -184,8 +184,9 @@ private:
     QStringList nextPictures() const;
     void orderPictures(const QStringList& next = {});
     void pictureSettled(const QString& path);
+    void findUnreadable(const QString& path, const Failure& why);
     void takeOut(const QString& path);
-    void tellTakenOut();
+    bool tellTakenOut();
     QStringList chosenThat(bool (PictureDoor::*is)(const QString&) const) const;
     void finishOnceMade();
     void showWaiting();

@@ -66,6 +66,7 @@ void kyoskNew::addFolder() {
 }
 
 void kyoskNew::turnTo(void (PictureChoice::*page)()) {
+    m_openWhenMade.clear();
     turnPage([&] {
         (m_choice.*page)();
         drawPage();
@@ -171,6 +172,7 @@ DrivePath kyoskNew::pictureToDraw(const QString& path) const {
 
 void kyoskNew::drawCells() {
     const unsigned drawing = ++m_drawing;
+    m_small.stopReadingAhead();
     drawDrafts();
     if (drawing != m_drawing)
         return;
@@ -186,7 +188,7 @@ void kyoskNew::drawCells() {
             Result<Bitmap>& picture = pictures[static_cast<std::size_t>(cell - first)];
             const bool waiting = m_door->isWaiting(m_choice.path(cell)); // its draft stays
             if (!picture && !waiting)
-                m_door->foundUnreadable(m_choice.path(cell));
+                findUnreadable(m_choice.path(cell), picture.failure());
             if (picture || !waiting)
                 shown.bitmap = picture ? std::move(*picture) : Bitmap();
             shown.visible = true;
@@ -198,6 +200,7 @@ void kyoskNew::drawCells() {
         if (drawing != m_drawing)
             return;
     }
+    tellTakenOut();
     Q_EMIT changed();
     readAhead();
 }

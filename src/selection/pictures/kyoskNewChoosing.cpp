@@ -4,6 +4,7 @@
 #include "editing/render/StoredSmallView.h"
 #include "order/EditRecord.h"
 #include "platform/Dialogs.h"
+#include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/HandOverFiles.h"
 #include "selection/door/PictureDoor.h"
@@ -104,6 +105,13 @@ void kyoskNew::cancelPage() {
 }
 
 void kyoskNew::chooseWholeFolder() {
+    // A folder of thousands on a card takes a while to look at.
+    const QStringList listed = m_choice.folders().paths().items();
+    for (qsizetype i = 0; m_door->isOpen() && i < listed.size(); ++i) {
+        m_door->worked(listed[i]);
+        if (i % 16 == 15)
+            m_platform.pump.pump();
+    }
     m_choice.chooseAll([this](const QString& path) { return m_door->isUnreadable(path); });
     Timer2.stop();
     for (Caption* part : {&Label35, &Image13, &Label36, &Image20})

@@ -25,13 +25,8 @@ void kyoskNew::openDoor(const HandOver& before) {
     m_choice.setWorked([this](const QString& listed) { return m_door->worked(listed); });
     if (!m_door->isOpen())
         return;
-    if (before.back && !before.doorFolder.isEmpty()) {
-        m_door->setFolder(before.doorFolder);
-    } else if (const Result<DrivePath> folder = makeDoorFolder(m_state, m_platform.files)) {
-        m_door->setFolder(*folder);
-    } else {
-        m_platform.dialogs.message(folder.failure().message);
-    }
+    m_door->setFolder(before.back && !before.doorFolder.isEmpty() ? before.doorFolder
+                                                                  : newDoorFolder(m_platform.files));
     m_door->setKept([this](const QString& path) { return m_choice.inBasket(path) || m_choice.page().contains(path); });
     connect(m_door.get(), &PictureDoor::settled, this, &kyoskNew::pictureSettled);
 }
@@ -44,12 +39,10 @@ DrivePath kyoskNew::shownPath(const QString& path) const {
 QString kyoskNew::unreadableText(const QString& path) const {
     switch (m_door->failureOf(path).kind) {
     case Failure::Kind::Unsupported:
-        return m_state.wording(u"סוג קובץ לא מוכר", u"unknown kind of file");
+        return m_state.wording(u"סוג קובץ שלא ניתן להציג", u"a kind of file that can't be shown");
+    case Failure::Kind::TimedOut:
     case Failure::Kind::TooLarge:
         return m_state.wording(u"התמונה גדולה מדי", u"this picture is too large");
-    case Failure::Kind::NotFound:
-    case Failure::Kind::AccessDenied:
-        return m_state.wording(u"לא ניתן לקרוא את הקובץ", u"this file can't be read");
     default:
         return m_state.wording(u"הקובץ פגום", u"this file is damaged");
     }
@@ -86,21 +79,28 @@ void kyoskNew::pictureSettled(const QString& path) {
     } else if (m_door->isUnreadable(path) && m_choice.inBasket(path)) {
         takeOut(path);
     }
-    if (chosenThat(&PictureDoor::isWaiting).isEmpty())
-        tellTakenOut();
+    const bool told = chosenThat(&PictureDoor::isWaiting).isEmpty() && tellTakenOut();
     m_resolution.look(path);
     repaint(path);
     showChoice();
     const bool opens = m_openWhenMade == path;
     if (opens)
         m_openWhenMade.clear();
-    if (!plain() && opens && m_chain.front() == this)
+    if (!plain() && opens && !m_picking && m_chain.front() == this)
         choosePicture(List2.find(path));
     else if (plain() && m_largePath.text() == path)
         showLarge(m_largePath);
-    if (doorPanel.visible)
+    if (doorPanel.visible && told)
+        stopWaiting(); // the customer looks at what is left
+    else if (doorPanel.visible)
         showWaiting();
     Q_EMIT changed();
+}
+
+void kyoskNew::findUnreadable(const QString& path, const Failure& why) {
+    m_door->foundUnreadable(path, why);
+    if (m_door->isUnreadable(path) && m_choice.inBasket(path))
+        takeOut(path);
 }
 
 void kyoskNew::takeOut(const QString& path) {
@@ -108,9 +108,10 @@ void kyoskNew::takeOut(const QString& path) {
     m_takenOut += shownPath(path).leaf();
 }
 
-void kyoskNew::tellTakenOut() {
+// True when there was anything to tell.
+bool kyoskNew::tellTakenOut() {
     if (m_takenOut.isEmpty())
-        return;
+        return false;
     QStringList names = m_takenOut.first(std::min(m_takenOut.size(), namesInMessage));
     if (m_takenOut.size() > namesInMessage)
         names += m_state.wording(u"ועוד %1", u"and %1 more").arg(m_takenOut.size() - namesInMessage);
@@ -118,6 +119,7 @@ void kyoskNew::tellTakenOut() {
     const QString told = m_state.wording(u"לא ניתן לקרוא תמונות אלה, והן הוצאו מההזמנה:\n%1",
                                          u"These pictures can't be read and were taken out of the order:\n%1");
     m_platform.dialogs.message(told.arg(names.join(u'\n')));
+    return true;
 }
 
 QStringList kyoskNew::chosenThat(bool (PictureDoor::*is)(const QString&) const) const {
@@ -128,6 +130,7 @@ QStringList kyoskNew::chosenThat(bool (PictureDoor::*is)(const QString&) const) 
 
 // The order goes on once the last chosen picture is made; what a full disk did not take is tried once more.
 void kyoskNew::finishOnceMade() {
+    m_openWhenMade.clear();
     orderPictures();
     showWaiting();
 }
