@@ -1,6 +1,7 @@
 #include "DiskFault.h"
 
 #include "common/HostFile.h"
+#include "door/DoorDecoder.h"
 #include "editing/render/StoredSmallView.h"
 #include "entry/details/DetailStore.h"
 #include "finished/pieces/Mod4split.h"
@@ -31,6 +32,8 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
     makeFolder(root);
     write(piece, "a whole print");
     write(root / u"b.jpp", "another print");
+    const HostPath upright = host(root / u"upright.jpg"), behindTheDoor = host(root / u"door.jpg");
+    ASSERT_TRUE(saveJpeg(Bitmap(9, 9, Qt::red), upright, 90));
     const auto failureOf = [](const auto& done) { return done.failure ? Result<void>(*done.failure) : Result<void>(); };
     const struct {
         DrivePath path;
@@ -52,6 +55,12 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
         {order.statePath(), [&] { return WriteOrderState(files, order, {}); }},
         {order.brokenFilesPath(), [&] { return WriteBrokenFiles(files, order, broken); }},
         {picture, [&] { return saveJpeg(Bitmap(9, 9, Qt::red), host(picture), 90); }},
+        {root / u"door.jpg",
+         [&] {
+             const auto made = DoorDecoder({}).make(upright, behindTheDoor);
+             return made ? Result<void>() : made.failure();
+         },
+         0},
         {root / u"copy", [&] { return files.copyFile(piece, root / u"copy"); }},
         {root / u"b_jpp_003_003.prk",
          [&] {
