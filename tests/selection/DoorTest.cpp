@@ -1,6 +1,5 @@
-#include "editing/editor/BigPics.h"
-#include "editing/editor/tFrmNew.h"
-#include "imaging/files/PictureFile.h"
+#include "ThePage.h"
+
 #include "order/DoorFolders.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
@@ -8,16 +7,11 @@
 #include "samples/SamplePhotographs.h"
 #include "samples/SamplePictureFiles.h"
 #include "selection/door/DoorNames.h"
-#include "selection/pictures/kyoskNew.h"
-#include "session/Workspace.h"
-#include "support/PageRig.h"
 
 #include <QElapsedTimer>
 #include <QFile>
 #include <QGuiApplication>
 #include <QSet>
-
-#include <gtest/gtest.h>
 
 namespace lumora {
 namespace {
@@ -39,21 +33,12 @@ TEST(DoorNames, AreInTheCodePageAndThereOnce) {
 
 const QString doorFolders = u"C:\\2000lumora\\zmany\\door"_s;
 
-class TheDoor : public testing::Test, protected PageRig {
+class TheDoor : public ThePage {
 protected:
     TheDoor() {
-        state.shemot.ppr = u"10/15"_s;
-        state.shemot.maat = u"מבריק"_s;
-        state.shemot.Bord = u"NB"_s;
-        state.Optint = OrderKind::Print;
         state.door = {true, true, true};
         state.EnglishTips = 1;
         machine.platform.doorProgram = LUMORA_DOOR;
-        registerPage<kyoskNew>(PageId::kyoskNew);
-        registerPage<tFrmNew>(PageId::tFrmNew);
-        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
-        registerBare({PageId::hatchala, PageId::Form2, PageId::B3});
-        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
         makeFolder(u"C:\\p"_path);
         const QByteArray jpeg = saved(picture, "JPG");
         put(u"a.jpg"_s, jpeg);
@@ -69,10 +54,8 @@ protected:
     void put(const QString& name, const QByteArray& bytes) { write(u"C:\\p"_path / name, bytes); }
 
     kyoskNew& openWithTheFolder() {
-        chain.show(PageId::kyoskNew);
-        auto& page = *chain.find<kyoskNew>();
-        machine.dialogs.picks += u"C:\\p\\a.jpg"_path;
-        page.Image5_Click();
+        kyoskNew& page = open();
+        pick(page, u"C:\\p\\a.jpg"_s);
         return page;
     }
     void waitUntil(const std::function<bool()>& done) {
@@ -132,8 +115,7 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     state.handOver.back = true;
     chain.unload(PageId::kyoskNew);
     EXPECT_EQ(made().size(), 3);
-    chain.show(PageId::kyoskNew);
-    auto& again = *chain.find<kyoskNew>();
+    kyoskNew& again = open();
     waitForCells(again);
     EXPECT_EQ(again.controls().Label7.text, u"4"_s);
     EXPECT_EQ(again.controls().Picture1[3].name + again.controls().Label4[3].text, u"d.heic1"_s);
@@ -188,8 +170,7 @@ TEST_F(TheDoor, ShowsWhatTheHeadersHoldAtOnceAndThenThePicturesThemselves) {
     ASSERT_GT(photograph.size() * 12, 3'000'000);
     for (int i = 0; i < 30; ++i)
         write(u"C:\\q"_path / u"%1.jpg"_s.arg(10 + i), jpegWith(photograph, exif(1, false, saved(old, "JPG"))));
-    chain.show(PageId::kyoskNew);
-    auto& page = *chain.find<kyoskNew>();
+    kyoskNew& page = open();
     const auto& cells = page.controls().Picture1;
     const auto isDraft = [&](std::size_t cell) {
         const QImage& drawn = cells[cell].bitmap.image();
@@ -201,8 +182,7 @@ TEST_F(TheDoor, ShowsWhatTheHeadersHoldAtOnceAndThenThePicturesThemselves) {
         if (firstSight == 0 && isDraft(0) && isDraft(11))
             firstSight = bytesRead() - before;
     });
-    machine.dialogs.picks += u"C:\\q\\10.jpg"_path;
-    page.Image5_Click();
+    pick(page, u"C:\\q\\10.jpg"_s);
     EXPECT_GT(firstSight, 12 * 1000);
     EXPECT_LT(firstSight, 1'000'000);
     for (std::size_t cell = 0; cell < cells.size(); ++cell)

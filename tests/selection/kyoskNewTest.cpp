@@ -1,34 +1,15 @@
-#include "selection/pictures/kyoskNew.h"
+#include "ThePage.h"
 
 #include "editing/caption/mikledet.h"
-#include "editing/editor/BigPics.h"
-#include "editing/editor/tFrmNew.h"
 #include "editing/render/StoredSmallView.h"
-#include "imaging/files/PictureFile.h"
 #include "order/BasketLine.h"
 #include "order/EditRecord.h"
-#include "session/Workspace.h"
-#include "support/PageRig.h"
-
-#include <gtest/gtest.h>
 
 namespace lumora {
 namespace {
 
-class ThePictures : public testing::Test, protected PageRig {
+class ThePictures : public ThePage {
 protected:
-    ThePictures() {
-        state.shemot.ppr = u"10/15"_s;
-        state.shemot.maat = u"מבריק"_s;
-        state.shemot.Bord = u"NB"_s;
-        state.Optint = OrderKind::Print;
-        registerPage<kyoskNew>(PageId::kyoskNew);
-        registerBare({PageId::hatchala, PageId::Form2, PageId::B3});
-        registerPage<tFrmNew>(PageId::tFrmNew);
-        chain.registerPage(PageId::BigPics, [] { return std::make_unique<BigPics>(); });
-        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace());
-    }
-
     tFrmNew& editor() { return chain.load<tFrmNew>(); }
 
     // count small pictures "01.jpg", ... in a folder; the folder is made.
@@ -38,16 +19,6 @@ protected:
             const QString name = u"%1.jpg"_s.arg(i, 2, 10, QLatin1Char('0'));
             ASSERT_TRUE(saveJpeg(Bitmap(size.width, size.height, Qt::red), host(folder / name), 80));
         }
-    }
-
-    kyoskNew& open() {
-        chain.show(PageId::kyoskNew);
-        return *chain.find<kyoskNew>();
-    }
-
-    void pick(kyoskNew& page, const QString& picture) {
-        machine.dialogs.picks += DrivePath(picture);
-        page.Image5_Click();
     }
 
     // The page with a folder of so many pictures.
