@@ -26,9 +26,9 @@ struct FtpFrmRig : SendingRig {
         writeLog();
         write(sheet(), QByteArray(900, 's'));
         registerBare({PageId::hatchala, PageId::MoogMeret});
-        registerPage<FtpFrm>();
-        registerPage<InetForm>();
-        registerPage<gdisave>();
+        registerPage<FtpFrm>(PageId::FtpFrm);
+        registerPage<InetForm>(PageId::InetForm);
+        registerPage<gdisave>(PageId::gdisave);
     }
 
     static QString sheet() { return u"!105_1234.jpp"_s; }

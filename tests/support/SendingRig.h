@@ -45,10 +45,6 @@ struct SendingRig : PageRig {
         if (!kept)
             (void)test.files.makeFolder(file);
     }
-    template <class P>
-    void registerPage() {
-        PageRig::registerPage<P>(P::pageId);
-    }
 
     TestPlatform& test = machine;
 };

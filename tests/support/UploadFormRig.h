@@ -21,7 +21,7 @@ struct UploadFormRig : SendingRig {
         write(log(), "the order");
         write(sheet(), QByteArray(900, 's'));
         write(third(), QByteArray("\xFF\xD8 third").repeated(50));
-        registerPage<UploadForm>();
+        registerPage<UploadForm>(PageId::UploadForm);
     }
 
     static QString sheet() { return u"!105_1234.jpg"_s; }

@@ -140,9 +140,6 @@ TEST_F(FtpSenderTest, MakesTheOrdersFolderOnceAndListsItAfterwards) {
     session.ListRemoteHere();
     EXPECT_TRUE(session.colNames.isEmpty());
     EXPECT_FALSE(session.bActiveSession || session.hOpen);
-    lab.refusesEntry = true;
-    walk();
-    EXPECT_FALSE(session.EnterOrderFolder() || session.inOrderFolder());
 }
 
 TEST_F(FtpSenderTest, NotesAFailedPutWithHourAndMinuteAsTheyAre) {
@@ -302,16 +299,6 @@ TEST_F(FtpSenderTest, AStopDoesNotWaitForTheOtherTriesToReachTheServer) {
         EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
         EXPECT_EQ(line.lab.connects, stoppedAt);
     }
-}
-
-TEST_F(FtpSenderTest, AStopBeforeTheCheckHasReadTheFolderLeavesOpenWhatArrived) {
-    remote() = whole();
-    test.pump.onPump = [&] {
-        if (told.count(CheckBegins) > 0)
-            sender.stopNow();
-    };
-    EXPECT_EQ(sender.RunAttempts(), SendingPhase::Stopped);
-    EXPECT_EQ(told.number(Counted), 3);
 }
 
 TEST_F(FtpSenderTest, ARecheckThatDoesNotReachTheFolderSaysSo) {

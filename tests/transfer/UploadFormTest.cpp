@@ -333,7 +333,6 @@ TEST_F(UploadFormTest, AnErrorPageDoesNotTellWhoseAFolderIs) {
     } cases[] = {
         {"the script's own answer", script, {"folder not found"}, false, SendingPhase::Success},
         {"no script", script, {"404 Not Found", 404}, std::nullopt},
-        {"busy", script, {"not now", 503}, std::nullopt},
         {"a short page", script, {"<html>You are not logged in"}, true},
         {"a long text", script, {"You are not logged in. Please log in to go on."}, true},
         {"a list with the word", script, {"a~~notes.jpp~~total:2"}, true},
@@ -507,21 +506,6 @@ TEST_F(UploadFormTest, AnOrderThatArrivedBeforeIsOnlyReported) {
     EXPECT_EQ(rig.start().phase(), SendingPhase::Success);
     EXPECT_EQ(lab.reports.size(), 2);
     EXPECT_EQ(lab.urls.size(), 2) << "no list";
-}
-
-TEST_F(UploadFormTest, NothingIsWrittenOutsideTheOrderAndTheKeptList) {
-    const auto outside = [&] {
-        QStringList all;
-        for (const QString& folder : {u"C:\\"_s, u"C:\\2000lumora"_s, u"C:\\2000lumora\\!!000"_s})
-            all += rig.test.files.names(DrivePath(folder), u"*.*"_s);
-        return all;
-    };
-    const QStringList before = outside();
-    lab.listInstead = UploadFormRig::name().toLatin1() +
-                      "~~..\\..\\evil.txt~~/tmp/evil.txt~~C:\\2000lumora\\evil.txt~~021015GNB0000_03AABB.jpp~~total:4";
-    rig.send();
-    EXPECT_EQ(outside(), before + QStringList(u"filelist1.txt"_s));
-    EXPECT_EQ(rig.localFiles().size(), 5u);
 }
 
 TEST_F(UploadFormTest, AFileThatNeverCameToTheLineIsNotLaidToTheServer) {
