@@ -44,26 +44,11 @@ TEST_F(PreparingAnEditedOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_EQ(machine.files.names(jobFolder, u"*.*"_s), QStringList({u"1 ~small.bmp"_s, u"12~תמונה 01.bmp"_s}));
     EXPECT_EQ(take(readPictureSize(host(jobFolder / u"12~תמונה 01.bmp"))), (PictureSize{300, 450}));
     EXPECT_FALSE(exists(u"C:\\2000lumora\\!!000\\^^^.jpg"_path)) << "goes at the end of each step";
-    EXPECT_EQ(read(u"C:\\vedron\\mispar.txt"_path), "106\r\n");
     EXPECT_EQ(front(), PageId::FtpFrm);
-    EXPECT_EQ(chain.find(PageId::B3), nullptr);
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
     const OrderFindings report = take(checkOrderFolder(host(folder()), {56, 30}));
     EXPECT_EQ(report.faults, QStringList());
     EXPECT_EQ(report.prints, 2);
-}
-
-TEST_F(PreparingAnEditedOrder, isCarefullyNotSentWithoutAPrint) {
-    const QString bad = giveFile(u"bad_1.jpg"_s, "no picture");
-    for (const bool careful : {false, true}) {
-        state.Careful = careful;
-        start(openEither(true, {edited(bad)}));
-        EXPECT_EQ(front(), careful ? PageId::B3 : PageId::FtpFrm);
-        EXPECT_TRUE(printFiles().isEmpty());
-        chain.unload(front());
-        std::filesystem::remove_all(host(folder()));
-        state.MisparHazmana = u"105"_s;
-    }
 }
 
 TEST_F(PreparingAnEditedOrder, keepsItsCorrectionsAndNoThumbnailsOnTheWayBack) {

@@ -38,15 +38,13 @@ protected:
         makeFolder(u"C:\\pics"_s);
     }
 
-    QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
-        const DrivePath path = u"C:\\pics"_path / name;
-        EXPECT_TRUE(machine.files.writeWhole(path, *encodeJpeg(Bitmap(width, height, colour), 92)));
-        return path.text();
-    }
     QString giveFile(const QString& name, const QByteArray& bytes) {
         const DrivePath path = u"C:\\pics"_path / name;
-        EXPECT_TRUE(machine.files.writeWhole(path, bytes));
+        write(path, bytes);
         return path.text();
+    }
+    QString givePicture(const QString& name, int width = 40, int height = 30, QColor colour = Qt::red) {
+        return giveFile(name, *encodeJpeg(Bitmap(width, height, colour), 92));
     }
 
     static QString line(const QString& path, const QString& copies = u"1 "_s) { return copies + u"1015GNB"_s + path; }

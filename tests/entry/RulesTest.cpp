@@ -6,8 +6,7 @@
 #include "common/FixedText.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
-#include "support/Take.h"
-#include "support/TestPlatform.h"
+#include "support/PageRig.h"
 
 #include <gtest/gtest.h>
 
@@ -75,14 +74,9 @@ TEST(DetailsCheckTest, FindsTheFirstFaultInTheOrderOfThePage) {
     EXPECT_EQ(CheckDetails(good)->place, Place::Address);
 }
 
-class DetailStoreTest : public ::testing::Test {
+class DetailStoreTest : public ::testing::Test, protected PageRig {
 protected:
-    DetailStoreTest() {
-        state.DiskRoot = machine.drives.programRoot();
-        EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace().ok());
-    }
-    TestPlatform machine;
-    SessionState state;
+    DetailStoreTest() { EXPECT_TRUE(Workspace(state, machine.files).MakeWorkspace().ok()); }
     DetailStore store{state, machine.files};
 };
 

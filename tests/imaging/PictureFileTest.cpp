@@ -4,11 +4,11 @@
 #include "common/HostFile.h"
 #include "imaging/files/BmpFile.h"
 #include "imaging/scaling/Resample.h"
+#include "samples/SamplePictureFiles.h"
 #include "support/JpegQuality.h"
 #include "support/PictureDifference.h"
 #include "support/Take.h"
 
-#include <QBuffer>
 #include <QDir>
 #include <QTemporaryDir>
 
@@ -32,14 +32,6 @@ protected:
     fs::path write(const std::string& name, const QByteArray& bytes) {
         EXPECT_TRUE(writeWholeFile(in(name), bytes));
         return in(name);
-    }
-
-    static QByteArray saved(const Bitmap& picture, const char* format) {
-        QByteArray bytes;
-        QBuffer buffer(&bytes);
-        buffer.open(QIODevice::WriteOnly);
-        EXPECT_TRUE(picture.image().save(&buffer, format));
-        return bytes;
     }
 
     QTemporaryDir m_folder;
@@ -105,8 +97,8 @@ TEST_F(PictureFileTest, aFaultyFileIsAFailureThatNamesItAndLeavesNoPrint) {
     const QByteArray jpeg = jpegOfKind(picture, {.across = 2, .down = 2});
     const QByteArray progressive = jpegOfKind(picture, {.progressive = true});
     const QByteArray restarts = jpegOfKind(picture, {.restartRows = 1});
-    const QByteArray bmp = saved(picture, "BMP");
-    const QByteArray png = saved(picture, "PNG");
+    const QByteArray bmp = saved(picture.image(), "BMP");
+    const QByteArray png = saved(picture.image(), "PNG");
     QByteArray damaged = restarts;
     const auto hit = damaged.size() * 2 / 3;
     damaged.replace(hit, 40, QByteArray(40, '\xFF'));
@@ -158,7 +150,7 @@ TEST_F(PictureFileTest, whatIsNoFileIsRefusedAtOnce) {
 TEST_F(PictureFileTest, theContentAndNotTheEndingSaysWhatAFileIs) {
     const Bitmap picture = testPicture(60, 40);
     for (const char* format : {"BMP", "PNG"}) {
-        const fs::path path = write("misnamed.jpg", saved(picture, format));
+        const fs::path path = write("misnamed.jpg", saved(picture.image(), format));
         EXPECT_EQ(take(readPictureSize(path)), (PictureSize{60, 40}));
         EXPECT_EQ(meanDifference(take(loadPicture(path)), picture), 0) << format;
         EXPECT_TRUE(scalePictureToJpeg(path, {30, 20}, 90));
@@ -168,7 +160,7 @@ TEST_F(PictureFileTest, theContentAndNotTheEndingSaysWhatAFileIs) {
 
 TEST_F(PictureFileTest, aWhiteOrTransparentPictureIsWhiteToItsEdgesAtEverySize) {
     const fs::path white = write("white.jpg", *encodeJpeg(Bitmap(403, 301, Qt::white), 92));
-    const fs::path glass = write("glass.png", saved(Bitmap(403, 301, QColor(255, 0, 0, 0)), "PNG"));
+    const fs::path glass = write("glass.png", saved(Bitmap(403, 301, QColor(255, 0, 0, 0)).image(), "PNG"));
     for (const PictureSize size : {PictureSize{403, 301}, PictureSize{201, 150}, PictureSize{115, 86},
                                    PictureSize{13, 9}, PictureSize{1, 1}, PictureSize{500, 400}}) {
         const Bitmap wanted(size.width, size.height, Qt::white);

@@ -36,11 +36,6 @@ TEST(ResampleTest, theWeightsOfEverySampleSumToExactlyOne) {
     }
 }
 
-TEST(ResampleTest, theSameSizeIsTheSamePicture) {
-    const Bitmap picture = testPicture(123, 77);
-    EXPECT_EQ(resampled(picture, {123, 77}).image(), picture.image());
-}
-
 TEST(ResampleTest, staysWithinTheRoundingOfTheExactCurve) {
     const Bitmap photograph = samplePhotograph({803, 601}, 7);
     for (const PictureSize size :

@@ -39,21 +39,12 @@ TEST(EditRecord, KeepsTheFirstFourCharactersOfAGain) {
 
 TEST(EditRecord, CutsWhatIsTooLongForItsField) {
     EditFields edit;
-    edit.RotationCode = -100;
     edit.PanX = -1000;
-    edit.TextFontSize = 100;
     edit.TextBody = QString(71, u'x');
     PackEditState(edit, u"NB"_s, {});
     EXPECT_EQ(edit.EditState.size(), EditRecord::width);
-    EXPECT_EQ(edit.EditState.mid(12, 3), u"-10"_s);
     EXPECT_EQ(edit.EditState.mid(18, 4), u"-100"_s);
-    EXPECT_EQ(edit.EditState.mid(54, 2), u"10"_s);
     EXPECT_EQ(edit.EditState.mid(126), QString(70, u'x') + u"    "_s);
-    edit.TextFontSize = 0;
-    PackEditState(edit, u"NB"_s, {});
-    EXPECT_EQ(edit.EditState.mid(54, 2), u"0 "_s);
-    UnpackEditState(edit.EditState, edit);
-    EXPECT_EQ(edit.TextFontSize, 8);
 }
 
 TEST(EditRecord, UnpacksByPositionAndReadsBlanksAsTheirDefaults) {

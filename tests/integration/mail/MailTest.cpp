@@ -1,3 +1,4 @@
+#include "common/HostFile.h"
 #include "finished/mail/MailResult.h"
 #include "platform/line/SmtpMail.h"
 #include "support/LabServers.h"
@@ -25,10 +26,9 @@ protected:
         QByteArray content(bytes, Qt::Uninitialized);
         for (int i = 0; i < bytes; ++i)
             content[i] = static_cast<char>(i * 31 + i / 256);
-        QFile file(folder.filePath(name));
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        EXPECT_EQ(file.write(content), bytes);
-        return toHostPath(file.fileName());
+        const HostPath path = toHostPath(folder.filePath(name));
+        EXPECT_TRUE(writeWholeFile(path, content));
+        return path;
     }
 
     // The code of the end; said stands in what is told for a log.
@@ -72,10 +72,7 @@ TEST_F(MailTest, AFileArrivesByteForByteWithSubjectBodyAndName) {
         const MailOutcome outcome = mail.send(server.account(encryption), message);
         ASSERT_EQ(outcome.end, MailEnd::Sent) << int(encryption) << outcome.words.toStdString();
         const QString box = folder.filePath(u"box"_s);
-        QFile file(box);
-        ASSERT_TRUE(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
-        file.write(server.mailbox());
-        file.close();
+        ASSERT_TRUE(writeWholeFile(toHostPath(box), server.mailbox()));
         QProcess reading;
         reading.setProcessChannelMode(QProcess::MergedChannels);
         reading.start(QStringLiteral(LUMORA_READ_MAIL), {box, folder.path()});
