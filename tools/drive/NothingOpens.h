@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QObject>
+#include <QStringList>
 #include <QUrl>
 
 namespace lumora {
@@ -12,8 +13,10 @@ public:
     NothingOpens();
     ~NothingOpens() override;
 
+    QStringList taken;
+
 public Q_SLOTS:
-    void take(const QUrl&) {}
+    void take(const QUrl& url) { taken += url.toString(); }
 };
 
 } // namespace lumora
