@@ -1,11 +1,11 @@
 #include "Walk.h"
 
-#include "imaging/files/PictureFile.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "samples/SamplePhotographs.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "support/Take.h"
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/Overlay.h"
 #include "views/window/MainWindow.h"
@@ -272,6 +272,22 @@ void Walk::toEditor() {
     go(toMenu + u"Image1(1) "_s + toOptions + toBorder + toPictures);
     pick(u"kyoskNew"_s, u"Image5"_s);
     go(u"Picture1(0)>tFrmNew"_s);
+}
+
+DrivePath Walk::writeFlashPhotograph() {
+    Bitmap picture = samplePhotograph(flashPhotograph, 5);
+    QPainter painter(&picture.image());
+    painter.setPen(Qt::NoPen);
+    QRadialGradient pupil(redEye, 17);
+    pupil.setColorAt(0, QColor(205, 34, 44));
+    pupil.setColorAt(1, QColor(120, 110, 100));
+    for (const auto& [radius, brush] :
+         {std::pair(80, QBrush(QColor(222, 178, 150))), {30, QBrush(QColor(96, 62, 40))}, {17, QBrush(pupil)}}) {
+        painter.setBrush(brush);
+        painter.drawEllipse(redEye, radius, radius);
+    }
+    write(pictureFolder() / u"IMG_0001.jpg", take(encodeJpeg(picture, 95)));
+    return pictureFolder() / u"IMG_0001.jpg";
 }
 
 void Walk::write(const DrivePath& path, const QByteArray& bytes) {

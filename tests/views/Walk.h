@@ -2,6 +2,7 @@
 
 #include "app/Program.h"
 #include "drive/ControlFinder.h"
+#include "imaging/files/PictureFile.h"
 #include "session/Page.h"
 #include "support/DrivePathLiteral.h"
 
@@ -74,6 +75,11 @@ public:
     void go(const QString& route, const std::function<void(const QString& name)>& look = {});
     // A quick order with the first picture open in the editor. The lab has frames in two categories.
     void toEditor();
+    void writeFrames();
+    // The first picture becomes one of this size with a red eye, there.
+    DrivePath writeFlashPhotograph();
+    static constexpr PictureSize flashPhotograph{2400, 1800};
+    static constexpr QPoint redEye{900, 700};
 
     // A file in a folder that is made where it is missing.
     void write(const DrivePath& path, const QByteArray& bytes);
@@ -86,7 +92,6 @@ private:
     Page* find(PageId id);
     ControlFinder finder() { return ControlFinder(m_program->window()); }
     void expectDone(const Result<void>& step);
-    void writeFrames();
 
     QTemporaryDir m_folder{QDir::tempPath() + u"/with-a-path-as-long-as-those-of-memory-cards-XXXXXX"_s};
     std::unique_ptr<Program> m_program;
