@@ -433,6 +433,7 @@ void PicturePicker::addHeading(const QString& words) {
 // By the times of the files, the newest day and picture first; the files come sorted by name.
 void PicturePicker::addByDays(const std::vector<HostPath>& files) {
     std::vector<std::pair<QDateTime, HostPath>> timed;
+    timed.reserve(files.size());
     for (const HostPath& file : files)
         timed.emplace_back(QFileInfo(toText(file)).lastModified(), file);
     std::stable_sort(timed.begin(), timed.end(), [](const auto& a, const auto& b) { return a.first > b.first; });
