@@ -46,20 +46,20 @@ void removeDoorFolders(const Files& files, const QStringList& lines) {
 
 void tidyDoorFolders(const SessionState& state, const Files& files) {
     const DrivePath all = doorFolders(files);
-    const QStringList numbers = files.folders(all);
-    if (numbers.isEmpty())
+    const QStringList names = files.folders(all);
+    if (names.isEmpty())
         return;
     QSet<QString> needed;
     const DrivePath orders = WorkspacePaths::orders(state);
-    for (const QString& name : files.folders(orders)) {
-        const Result<OrderState> order = ReadOrderState(files, OrderFolder(orders / name));
+    for (const QString& leaf : files.folders(orders)) {
+        const Result<OrderState> order = ReadOrderState(files, OrderFolder(orders / leaf));
         const bool leaves = order && order->way != OrderState::Way::Station && order->way != OrderState::Way::Mail;
         if (order &&
             (order->phase == OrderState::Phase::Preparing || (leaves && order->phase < OrderState::Phase::Sending)))
             needed += foldersOf(order->items, files);
     }
-    for (const QString& number : numbers) {
-        if (const DrivePath folder = all / number; !needed.contains(folder.text()))
+    for (const QString& name : names) {
+        if (const DrivePath folder = all / name; !needed.contains(folder.text()))
             static_cast<void>(files.removeTree(folder));
     }
 }

@@ -185,7 +185,7 @@ private:
     void orderPictures(const QStringList& next = {});
     void pictureSettled(const QString& path);
     void findUnreadable(const QString& path, const Failure& why);
-    void takeOut(const QString& path);
+    void takeOutUnreadable(const QString& path);
     bool tellTakenOut();
     QStringList chosenThat(bool (PictureDoor::*is)(const QString&) const) const;
     void finishOnceMade();

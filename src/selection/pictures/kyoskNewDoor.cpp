@@ -73,12 +73,9 @@ QStringList kyoskNew::nextPictures() const {
 void kyoskNew::pictureSettled(const QString& path) {
     if (m_handedOver)
         return;
-    if (m_door->isNotMade(path)) {
-        if (!doorPanel.visible && !std::exchange(m_notMadeTold, true))
-            tellNotMade(path);
-    } else if (m_door->isUnreadable(path) && m_choice.inBasket(path)) {
-        takeOut(path);
-    }
+    if (m_door->isNotMade(path) && !doorPanel.visible && !std::exchange(m_notMadeTold, true))
+        tellNotMade(path);
+    takeOutUnreadable(path);
     const bool told = chosenThat(&PictureDoor::isWaiting).isEmpty() && tellTakenOut();
     m_resolution.look(path);
     repaint(path);
@@ -99,11 +96,12 @@ void kyoskNew::pictureSettled(const QString& path) {
 
 void kyoskNew::findUnreadable(const QString& path, const Failure& why) {
     m_door->foundUnreadable(path, why);
-    if (m_door->isUnreadable(path) && m_choice.inBasket(path))
-        takeOut(path);
+    takeOutUnreadable(path);
 }
 
-void kyoskNew::takeOut(const QString& path) {
+void kyoskNew::takeOutUnreadable(const QString& path) {
+    if (!m_door->isUnreadable(path) || !m_choice.inBasket(path))
+        return;
     m_choice.remove(path);
     m_takenOut += shownPath(path).leaf();
 }
