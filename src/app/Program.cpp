@@ -3,6 +3,7 @@
 #include "app/DesktopShell.h"
 #include "app/PageRegister.h"
 #include "common/HostFile.h"
+#include "common/Warning.h"
 #include "platform/ForwardCall.h"
 #include "platform/Instances.h"
 #include "platform/NetworkCards.h"
@@ -28,7 +29,6 @@
 #include <QTimer>
 
 #include <cassert>
-#include <cstdio>
 #include <optional>
 #include <utility>
 
@@ -37,10 +37,6 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 namespace {
-
-void warn(const QString& text) {
-    std::fprintf(stderr, "lumora: %s\n", qPrintable(text));
-}
 
 // Beside this program, or where a build has it.
 HostPath doorProgram() {
@@ -61,7 +57,9 @@ struct Program::Parts {
         , instances(std::move(run))
         , fileSystem(drives)
         , volume(fileSystem, dataFolder, NetworkCards(),
-                 [](const Failure& why) { warn(u"the mark of the data folder can't be kept: %1"_s.arg(why.message)); })
+                 [](const Failure& why) {
+                     writeWarning(u"the mark of the data folder can't be kept: %1"_s.arg(why.message));
+                 })
         , cards(deployment.watchedCards ? std::move(media) : Cards::Source(), deployment.door.everyFormat)
         , internet({}, deployment.ftpType)
         , shell(drives)
@@ -130,7 +128,7 @@ Result<void> Program::start() {
     if (labFile)
         reading = ReadLabFile(*labFile);
     for (const QString& warning : reading.warnings)
-        warn(warning);
+        writeWarning(warning);
     if (!reading.errors.isEmpty())
         return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
     if (m_options.operatorArea)
@@ -161,7 +159,7 @@ Result<void> Program::start() {
                            run.fault()->message)};
     }
     if (run.fault())
-        warn(u"the data folder can't be locked: %1"_s.arg(run.fault()->message));
+        writeWarning(u"the data folder can't be locked: %1"_s.arg(run.fault()->message));
     if (run.refused()) {
         m_otherCameForward = CallForward(dataFolder);
         return Failure{

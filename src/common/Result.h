@@ -22,7 +22,8 @@ struct Failure {
         Refused,      // the other side answered no
         Disconnected, // no line, or the line was cut
         TimedOut,
-        InUse, // another program has it
+        InUse,     // another program has it
+        NoProgram, // a program of ours can't be started
         Other,
     };
     Kind kind = Kind::Other;

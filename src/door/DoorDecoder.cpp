@@ -44,6 +44,13 @@ Failure notRead(const std::filesystem::path& source, int error) {
     return fileFailure(source, u"can't be read"_s, error);
 }
 
+// A card that is pulled out, or breaks, says so in many ways.
+Failure ofSource(Failure failure) {
+    if (failure.kind == Failure::Kind::Other)
+        failure.kind = Failure::Kind::NotFound;
+    return failure;
+}
+
 Result<DoorNeed> needOf(const PictureHeader& header, const Descriptor& file, const std::filesystem::path& source,
                         DoorRules rules = {true, true, true}) {
     const DoorNeed need = doorNeedOf(header, shownPath(source), rules);
@@ -206,7 +213,7 @@ Result<bool> madeOf(int status, const std::filesystem::path& source) {
     case DoorStatus::Hdr:
         return pictureFailure(source, Kind::Unsupported, u"a picture of high dynamic range can't be shown"_s);
     case DoorStatus::NotRead:
-        return notRead(source, EIO);
+        return ofSource(notRead(source, EIO));
     case DoorStatus::NotConfined:
         return pictureFailure(source, Kind::Other, u"this machine does not let a decoder be locked in"_s);
     case DoorStatus::Damaged:
@@ -235,7 +242,7 @@ Result<Decoded> decoded(const std::filesystem::path& program, const DoorLimits& 
     Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
     Child child;
     if (const int error = made.valid() ? child.start(program, limits, file.number(), made.number()) : errno; error != 0)
-        return Failure{Failure::Kind::Other, fileFailure(program, u"can't be started"_s, error).message};
+        return Failure{Failure::Kind::NoProgram, fileFailure(program, u"can't be started"_s, error).message};
     int status = 0;
     const int error = child.ended(limits.seconds, stop, status);
     if (error == ETIMEDOUT)
@@ -261,7 +268,7 @@ DoorDecoder::DoorDecoder(std::filesystem::path program, DoorLimits limits)
 Result<DoorNeed> DoorDecoder::needOf(const std::filesystem::path& source, DoorRules rules) {
     const auto file = openSource(source, shownPath(source));
     const auto header = file ? headerOf(*file, source) : file.failure();
-    return header ? lumora::needOf(*header, *file, source, rules) : header.failure();
+    return header ? lumora::needOf(*header, *file, source, rules) : ofSource(header.failure());
 }
 
 Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source, const std::filesystem::path& target,
@@ -269,7 +276,7 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     const auto file = openSource(source, shownPath(source));
     const auto header = file ? headerOf(*file, source) : file.failure();
     if (!header)
-        return header.failure();
+        return ofSource(header.failure());
     const auto need = lumora::needOf(*header, *file, source);
     if (!need)
         return need.failure();
@@ -280,10 +287,12 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
         return picture.failure();
     NewContent content(target, shownPath(target));
     if (const auto done = appendFrom(copied ? *file : picture->file, toTheEnd, content, shownPath(source)); !done)
-        return done.failure();
+        return ofSource(done.failure());
     // What is lost by a crash is made again from the customer's file.
-    if (auto written = content.commit(NewContent::Durability::Passing); !written)
-        return written.failure();
+    if (auto written = content.commit(NewContent::Durability::Passing); !written) {
+        const bool full = written.failure().kind == Failure::Kind::NoSpace;
+        return Failure{full ? Failure::Kind::NoSpace : Failure::Kind::Other, written.failure().message};
+    }
     return Made{picture->profileIgnored};
 }
 

@@ -9,6 +9,9 @@
 
 namespace lumora {
 
+// What is said behind the name of a file where DoorDecoder::Made tells it.
+inline constexpr QStringView profileIgnoredWords = u": its colour profile is broken and was ignored";
+
 // Makes the JPEG file that the pages work with of a picture file of any kind. What takes more than a copy is done by a
 // child process without rights, since decoders of strangers' formats are where attacks come in. Calls block; several
 // threads may call.

@@ -372,10 +372,10 @@ TEST_F(DoorTest, ARefusalTellsWhyAndLeavesNothing) {
     expectRefused(huge, Failure::Kind::TooLarge, m_decoder);
     expectRefused(QByteArray(heic).replace(heic.indexOf("infe") + 12, 4, "vvc1"), Failure::Kind::Unsupported,
                   m_decoder);
-    EXPECT_EQ(DoorDecoder::needOf("/proc/self/mem").failure().kind, Failure::Kind::Other) << "no address 0";
+    EXPECT_EQ(DoorDecoder::needOf("/proc/self/mem").failure().kind, Failure::Kind::NotFound) << "no address 0";
     if (memoryIsLimited)
         expectRefused(png, Failure::Kind::TooLarge, DoorDecoder(LUMORA_DOOR, {30, 32 << 20}));
-    expectRefused(png, Failure::Kind::Other, DoorDecoder(in("nowhere")));
+    expectRefused(png, Failure::Kind::NoProgram, DoorDecoder(in("nowhere")));
 }
 
 TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
@@ -387,7 +387,7 @@ TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
         {Kind::TimedOut, {"loops", "waits"}},
         {Kind::TooLarge, {"is killed", memoryIsLimited ? "eats memory" : "is killed"}},
         {Kind::Other, {"reads a file", "opens the net", "begins a process", "aborts its parent", "runs its own code"}},
-        {Kind::Other, {"says that it read nothing"}},
+        {Kind::NotFound, {"says that it read nothing"}},
         {Kind::Damaged, {"aborts", "says done of rubbish", "says done of half"}},
     };
     // A signal that comes again and again begins no wait anew.

@@ -61,7 +61,6 @@ int main(int argc, char** argv) {
         return pictureFailed;
     }
     if (made->profileIgnored)
-        complain(QString::fromStdString(arguments[0]) +
-                 QStringLiteral(": its colour profile is broken and was ignored"));
+        complain(QString::fromStdString(arguments[0]) + profileIgnoredWords.toString());
     return allWell;
 }

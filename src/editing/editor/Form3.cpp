@@ -6,6 +6,8 @@
 #include "platform/files/Files.h"
 #include "session/CaptionTexts.h"
 #include "session/PageChain.h"
+#include "session/SessionState.h"
+#include "session/SharedWords.h"
 
 #include <algorithm>
 
@@ -60,7 +62,9 @@ void Form3::draw() {
             std::swap(Picture2Box.width, Picture2Box.height);
     } else {
         Picture2Box = {};
-        m_platform.dialogs.message(picture.failure().message);
+        m_platform.dialogs.message(
+            m_state.wording(u"לא ניתן לפתוח את התמונה %1.\n%2", u"The picture %1 can't be opened.\n%2")
+                .arg(m_path.leaf(), failureWords(m_state, picture.failure())));
     }
     unreadable.visible = Picture2.isNull();
     Q_EMIT changed();

@@ -10,6 +10,7 @@
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/SharedWords.h"
 #include "session/Workspace.h"
 
 #include <QBuffer>
@@ -158,7 +159,7 @@ bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
         EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
         tell(u"לא ניתן לפתוח את התמונה לעריכה"_s, u"The picture can't be opened for editing"_s,
-             opened.failure().message);
+             failureWords(m_state, opened.failure()));
         return false;
     }
     surfaces().open(std::move(*opened));

@@ -11,6 +11,7 @@
 #include "platform/line/BlockingCall.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/SharedWords.h"
 #include "session/Workspace.h"
 
 #include <cmath>
@@ -106,7 +107,7 @@ void RedI::open(const DrivePath& path) {
     endWait();
     if (!opened) {
         tellFailure(u"לא ניתן לפתוח את התמונה לתיקון.\n%1"_s, u"The picture can't be opened for correction.\n%1"_s,
-                    opened.failure());
+                    {opened.failure().kind, failureWords(m_state, opened.failure())});
         close();
         return;
     }

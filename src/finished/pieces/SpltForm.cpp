@@ -6,6 +6,7 @@
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/SharedWords.h"
 #include "session/Workspace.h"
 
 #include <algorithm>
@@ -293,10 +294,7 @@ void SpltForm::tellTroubles() {
     constexpr int told = 2;
     if (m_troubles.isEmpty())
         return;
-    QString text = m_troubles.mid(0, told).join(u"\n\n"_s);
-    if (m_troubles.size() > told)
-        text += u"\n\n"_s + wording(u"ועוד %1 כאלה."_s, u"And %1 more."_s).arg(m_troubles.size() - told);
-    m_platform.dialogs.message(text);
+    m_platform.dialogs.message(shortList(m_state, m_troubles, told, u"\n\n"_s));
 }
 
 void SpltForm::goBack() {
