@@ -1,8 +1,22 @@
 #include "selection/SmallPictures.h"
 
+#include <QThreadPool>
+
+#include <optional>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+QThreadPool& reader() {
+    static QThreadPool pool;
+    pool.setMaxThreadCount(1);
+    return pool;
+}
+
+} // namespace
 
 QString SmallPictures::keyOf(const HostPath& path, int cell) {
     std::error_code absent;
@@ -11,17 +25,16 @@ QString SmallPictures::keyOf(const HostPath& path, int cell) {
     return absent ? QString() : u"%1|%2|%3|"_s.arg(cell).arg(length).arg(time) + toText(path);
 }
 
-void SmallPictures::keep(const QString& key, const Result<Bitmap>& picture) {
-    if (!picture || key.isEmpty())
-        return;
-    const std::lock_guard lock(m_mutex);
-    m_kept.insert(key, new Bitmap(*picture), picture->image().sizeInBytes());
+bool SmallPictures::Kept::has(const QString& key) {
+    const std::lock_guard lock(mutex);
+    return pictures.contains(key);
 }
 
-bool SmallPictures::keeps(const HostPath& path, int cell) const {
-    const QString key = keyOf(path, cell);
-    const std::lock_guard lock(m_mutex);
-    return m_kept.contains(key);
+void SmallPictures::Kept::keep(const QString& key, const Result<Bitmap>& picture) {
+    if (!picture || key.isEmpty())
+        return;
+    const std::lock_guard lock(mutex);
+    pictures.insert(key, new Bitmap(*picture), picture->image().sizeInBytes());
 }
 
 std::vector<Result<Bitmap>> SmallPictures::load(const std::vector<HostPath>& paths, int cell) {
@@ -30,8 +43,8 @@ std::vector<Result<Bitmap>> SmallPictures::load(const std::vector<HostPath>& pat
     std::vector<std::optional<Result<Bitmap>>> found(paths.size());
     for (std::size_t i = 0; i < paths.size(); ++i) {
         keys.push_back(keyOf(paths[i], cell));
-        const std::lock_guard lock(m_mutex);
-        if (const Bitmap* kept = m_kept.object(keys[i]))
+        const std::lock_guard lock(m_kept->mutex);
+        if (const Bitmap* kept = m_kept->pictures.object(keys[i]))
             found[i] = *kept;
         else
             unknown.push_back(paths[i]);
@@ -41,7 +54,7 @@ std::vector<Result<Bitmap>> SmallPictures::load(const std::vector<HostPath>& pat
     for (std::size_t i = 0, next = 0; i < paths.size(); ++i) {
         if (!found[i]) {
             found[i] = std::move(read[next++]);
-            keep(keys[i], *found[i]);
+            m_kept->keep(keys[i], *found[i]);
         }
         all.push_back(std::move(*found[i]));
     }
@@ -49,13 +62,13 @@ std::vector<Result<Bitmap>> SmallPictures::load(const std::vector<HostPath>& pat
 }
 
 void SmallPictures::readAhead(const std::vector<HostPath>& paths, int cell) {
-    m_reader = std::jthread([this, paths, cell](const std::stop_token& stop) {
+    reader().start([kept = m_kept, request = ++m_kept->request, paths, cell] {
         for (const HostPath& path : paths) {
-            if (stop.stop_requested())
+            if (kept->request != request)
                 return;
             const QString key = keyOf(path, cell);
-            if (!keeps(path, cell))
-                keep(key, loadSmallPictures({path}, cell).front());
+            if (!kept->has(key))
+                kept->keep(key, loadSmallPictures({path}, cell).front());
         }
     });
 }

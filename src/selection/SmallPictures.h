@@ -6,9 +6,9 @@
 #include <QCache>
 #include <QString>
 
+#include <atomic>
+#include <memory>
 #include <mutex>
-#include <optional>
-#include <thread>
 #include <vector>
 
 namespace lumora {
@@ -18,21 +18,33 @@ namespace lumora {
 // again.
 class SmallPictures {
 public:
+    SmallPictures() = default;
+    SmallPictures(const SmallPictures&) = delete;
+    SmallPictures& operator=(const SmallPictures&) = delete;
+    ~SmallPictures() { stopReadingAhead(); }
+
     // As loadSmallPictures().
     std::vector<Result<Bitmap>> load(const std::vector<HostPath>& paths, int cell);
-    bool keeps(const HostPath& path, int cell) const;
+    bool keeps(const HostPath& path, int cell) const { return m_kept->has(keyOf(path, cell)); }
 
-    // Reads these in the background, one after the other.
+    // Reads these in the background, one after the other, and nothing else any more. Does not wait for the picture that
+    // is being read.
     void readAhead(const std::vector<HostPath>& paths, int cell);
-    void stopReadingAhead() { m_reader.request_stop(); }
+    void stopReadingAhead() { ++m_kept->request; }
 
 private:
-    static QString keyOf(const HostPath& path, int cell);
-    void keep(const QString& key, const Result<Bitmap>& picture);
+    // The reader holds it too, and may end after this.
+    struct Kept {
+        bool has(const QString& key);
+        void keep(const QString& key, const Result<Bitmap>& picture);
 
-    mutable std::mutex m_mutex;
-    QCache<QString, Bitmap> m_kept{qsizetype(64) << 20}; // costs are bytes
-    std::jthread m_reader;                               // goes first, since it uses the others
+        std::mutex mutex;
+        QCache<QString, Bitmap> pictures{qsizetype(64) << 20}; // costs are bytes
+        std::atomic<unsigned> request = 0;                     // the latest; the reader gives up an earlier one
+    };
+    static QString keyOf(const HostPath& path, int cell);
+
+    std::shared_ptr<Kept> m_kept = std::make_shared<Kept>();
 };
 
 } // namespace lumora

@@ -12,6 +12,7 @@
 
 #include <QAbstractButton>
 #include <QApplication>
+#include <QBuffer>
 #include <QCheckBox>
 #include <QClipboard>
 #include <QRegularExpression>
@@ -179,6 +180,14 @@ void Scene::go(const QString& route) {
         {u"@frames"_s, [&] { m_walk.writeFrames(); }},
         {u"@home"_s, [&] { m_state.MishloachHabaita = true; }},
         {u"@damaged"_s, [&] { m_walk.write(pictures / u"IMG_0002.jpg", "no picture"); }},
+        {u"@large"_s,
+         [&] {
+             QByteArray png;
+             QBuffer buffer(&png);
+             QImage(8000, 8000, QImage::Format_Mono).save(&buffer, "PNG");
+             for (const auto& name : {u"A1.png"_s, u"A2.png"_s, u"A3.png"_s})
+                 m_walk.write(pictures / name, png);
+         }},
         {u"@red"_s, [&] { m_walk.writeFlashPhotograph(); }},
         {u"@lines"_s,
          [&] {

@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/PictureName.h"
+#include "common/Warning.h"
 #include "door/PictureDraft.h"
 #include "platform/files/Files.h"
 #include "selection/door/DoorNames.h"
@@ -43,6 +44,8 @@ Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, c
     const Result<DoorDecoder::Made> made = decoder.make(source, target, stop);
     if (!made)
         return made.failure();
+    if (made->profileIgnored)
+        writeWarning(toText(source.filename()) + profileIgnoredWords.toString());
     std::error_code passedOver;
     if (!untold && std::filesystem::last_write_time(source, passedOver) == time)
         std::filesystem::last_write_time(target, time, passedOver);
@@ -204,11 +207,8 @@ void PictureDoor::want(const QStringList& worked) {
 }
 
 void PictureDoor::startNext() {
-    while (m_running < madeAtOnce && !m_wanted.isEmpty()) {
-        Picture* next = find(m_wanted.takeFirst());
-        if (next && next->state == State::Waiting && !next->inHand)
-            start(*next);
-    }
+    while (m_running < madeAtOnce && !m_wanted.isEmpty())
+        start(*find(m_wanted.takeFirst()));
 }
 
 void PictureDoor::start(Picture& picture) {

@@ -28,6 +28,7 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
     , m_platform(platform)
     , m_chain(chain)
     , m_door(std::make_unique<PictureDoor>(platform.files, DoorDecoder(platform.doorProgram), state.door))
+    , m_wait(state, *m_door)
     , m_choice(state)
     , m_resolution(state, platform.files)
     , File1(platform.files, picturePatterns(state.door.everyFormat),

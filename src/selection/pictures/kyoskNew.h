@@ -8,6 +8,7 @@
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
 #include "selection/SmallPictures.h"
+#include "selection/door/DoorWait.h"
 #include "selection/pictures/kyoskNewControls.h"
 #include "session/Page.h"
 #include "session/PageFlow.h"
@@ -84,7 +85,7 @@ public:
     // Finishing.
     void Image7_Click() { finish(); }
     void Image13_Click() { finishAlbum(); }
-    void Command3_Click() { checkAndClose(); }
+    void Command3_Click() { onceMade(&kyoskNew::checkAndClose); }
     void Command4Snif_Click(int branch) { chooseBranch(branch); }
     void Command4Snif_MouseMove(int branch) { showBranch(branch); } // also when it takes the focus
     void doorBack_Click() { stopWaiting(); }
@@ -187,10 +188,8 @@ private:
     void findUnreadable(const QString& path, const Failure& why);
     void takeOutUnreadable(const QString& path);
     bool tellTakenOut();
-    QStringList chosenThat(bool (PictureDoor::*is)(const QString&) const) const;
-    void finishOnceMade();
+    void onceMade(void (kyoskNew::*goOn)());
     void showWaiting();
-    void tellNotMade(const QString& path);
     void stopWaiting();
     QString unreadableText(const QString& path) const;
     DrivePath shownPath(const QString& path) const;
@@ -237,6 +236,8 @@ private:
     const Platform& m_platform;
     PageChain& m_chain;
     std::unique_ptr<PictureDoor> m_door;
+    DoorWait m_wait;
+    void (kyoskNew::*m_onceMade)() = &kyoskNew::openFinish;
     PictureChoice m_choice;
     OrderResolution m_resolution;
     SmallPictures m_small;
@@ -260,11 +261,9 @@ private:
     Guide m_guide = Guide::None;
     PrintGrade m_grade = PrintGrade::Unmarked; // what Label6 tells, and of which size
     PictureSize m_gradedSize;
-    PictureSize m_largeSize;    // of the picture in the large view
-    QString m_openWhenMade;     // the picture that goes into the editor once it is made
-    bool m_notMadeTold = false; // that the disk has not taken a picture
-    QStringList m_takenOut;     // names of chosen pictures that can't be printed, until the customer is told
-    QStringList m_coarse;       // the paths that the closing panel tells of
+    PictureSize m_largeSize; // of the picture in the large view
+    QString m_openWhenMade;  // the picture that goes into the editor once it is made
+    QStringList m_coarse;    // the paths that the closing panel tells of
     QString m_focusBox;
     int m_focusRequest = 0;
 };

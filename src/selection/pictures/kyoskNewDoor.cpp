@@ -8,17 +8,10 @@
 #include "session/SessionState.h"
 
 #include <algorithm>
-#include <utility>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-constexpr qsizetype namesInMessage = 8;
-
-} // namespace
 
 // An order that comes back finds its pictures where they were made.
 void kyoskNew::openDoor(const HandOver& before) {
@@ -73,10 +66,12 @@ QStringList kyoskNew::nextPictures() const {
 void kyoskNew::pictureSettled(const QString& path) {
     if (m_handedOver)
         return;
-    if (m_door->isNotMade(path) && !doorPanel.visible && !std::exchange(m_notMadeTold, true))
-        tellNotMade(path);
+    if (m_wait.tellsAtOnce(path))
+        m_platform.dialogs.message(m_wait.notMadeWords(path));
     takeOutUnreadable(path);
-    const bool told = chosenThat(&PictureDoor::isWaiting).isEmpty() && tellTakenOut();
+    const QStringList chosen = m_choice.basket().paths();
+    const bool anyWaits = std::ranges::any_of(chosen, [this](const QString& one) { return m_door->isWaiting(one); });
+    const bool told = !anyWaits && tellTakenOut();
     m_resolution.look(path);
     repaint(path);
     showChoice();
@@ -87,9 +82,9 @@ void kyoskNew::pictureSettled(const QString& path) {
         choosePicture(List2.find(path));
     else if (plain() && m_largePath.text() == path)
         showLarge(m_largePath);
-    if (doorPanel.visible && told)
+    if (m_wait.waits() && told)
         stopWaiting(); // the customer looks at what is left
-    else if (doorPanel.visible)
+    else if (m_wait.waits())
         showWaiting();
     Q_EMIT changed();
 }
@@ -103,63 +98,40 @@ void kyoskNew::takeOutUnreadable(const QString& path) {
     if (!m_door->isUnreadable(path) || !m_choice.inBasket(path))
         return;
     m_choice.remove(path);
-    m_takenOut += shownPath(path).leaf();
+    m_wait.takeOut(shownPath(path).leaf());
 }
 
 // True when there was anything to tell.
 bool kyoskNew::tellTakenOut() {
-    if (m_takenOut.isEmpty())
-        return false;
-    QStringList names = m_takenOut.first(std::min(m_takenOut.size(), namesInMessage));
-    if (m_takenOut.size() > namesInMessage)
-        names += m_state.wording(u"ועוד %1", u"and %1 more").arg(m_takenOut.size() - namesInMessage);
-    m_takenOut.clear();
-    const QString told = m_state.wording(u"לא ניתן לקרוא תמונות אלה, והן הוצאו מההזמנה:\n%1",
-                                         u"These pictures can't be read and were taken out of the order:\n%1");
-    m_platform.dialogs.message(told.arg(names.join(u'\n')));
-    return true;
+    const QString words = m_wait.takenOutWords();
+    if (!words.isEmpty())
+        m_platform.dialogs.message(words);
+    return !words.isEmpty();
 }
 
-QStringList kyoskNew::chosenThat(bool (PictureDoor::*is)(const QString&) const) const {
-    QStringList chosen = m_choice.basket().paths();
-    chosen.removeIf([&](const QString& path) { return !(*m_door.*is)(path); });
-    return chosen;
-}
-
-// The order goes on once the last chosen picture is made; what a full disk did not take is tried once more.
-void kyoskNew::finishOnceMade() {
+// Goes on once the last chosen picture is made; what a full disk did not take is tried once more.
+void kyoskNew::onceMade(void (kyoskNew::*goOn)()) {
     m_openWhenMade.clear();
+    m_onceMade = goOn;
     orderPictures();
     showWaiting();
 }
 
 void kyoskNew::showWaiting() {
-    const qsizetype chosen = m_choice.basket().count();
-    const qsizetype waiting = chosenThat(&PictureDoor::isWaiting).size();
-    const QStringList notMade = chosenThat(&PictureDoor::isNotMade);
-    doorPanel.visible = waiting > 0;
-    doorShare = chosen > 0 ? 1 - static_cast<double>(waiting) / static_cast<double>(chosen) : 1;
-    doorCount.text = u"%1 / %2"_s.arg(chosen - waiting).arg(chosen);
-    if (waiting > 0)
-        Q_EMIT changed();
-    else if (notMade.isEmpty())
-        openFinish();
+    const DoorWait::Then then = m_wait.count(m_choice.basket().paths());
+    doorPanel.visible = m_wait.waits();
+    doorShare = m_wait.share();
+    doorCount.text = m_wait.counted();
+    if (then == DoorWait::Then::GoOn)
+        (this->*m_onceMade)();
+    else if (then == DoorWait::Then::TellNotMade)
+        m_platform.dialogs.message(m_wait.notMadeWords());
     else
-        tellNotMade(notMade.first());
-}
-
-void kyoskNew::tellNotMade(const QString& path) {
-    const Failure why = m_door->failureOf(path);
-    const QString reason =
-        why.kind == Failure::Kind::NoSpace ? m_state.wording(u"הדיסק מלא", u"The disk is full") : why.message;
-    m_platform.dialogs.message(
-        m_state
-            .wording(u"התמונה %1 לא הוכנה להזמנה.\nמה שכבר הוכן נשמר. נא לפנות לצוות.\n%2",
-                     u"The picture %1 could not be made ready.\nWhat is ready stays. Please ask the staff.\n%2")
-            .arg(shownPath(path).leaf(), reason));
+        Q_EMIT changed();
 }
 
 void kyoskNew::stopWaiting() {
+    m_wait.stop();
     doorPanel.visible = false;
     Q_EMIT changed();
 }

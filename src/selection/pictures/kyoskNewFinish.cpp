@@ -23,7 +23,7 @@ const QString notTyped = u"לא הוקלד"_s; // the mail address of a customer
 } // namespace
 
 void kyoskNew::finish() {
-    finishOnceMade();
+    onceMade(&kyoskNew::openFinish);
 }
 
 void kyoskNew::openFinish() {
