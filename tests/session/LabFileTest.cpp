@@ -74,7 +74,8 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
         QStringList told; // each stands in the one message
     } cases[] = {
         {"[Servers]\nHost = a\n", {"lab.ini:1:", "\"Servers\"", "[Server]", "[Drives]"}},
-        {"[Server\nHost = a\n", {"lab.ini:1:", "allowed"}},
+        {"[Server\nHost = a\n", {"lab.ini:1:", "\"Server\" lacks its closing bracket", "[Server]"}},
+        {"[Server] # ours\nHost = a\n", {"lab.ini:1:", "behind the closing bracket of the section \"Server\""}},
         {"Host = a\n", {"lab.ini:1:", "before the first [section]"}},
         {"[Server]\nHots = a\n", {"lab.ini:2:", "\"Hots\"", "Host, User"}},
         {"[Server]\njust words\n", {"lab.ini:2:", "key = value"}},

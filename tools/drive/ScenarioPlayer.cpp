@@ -35,6 +35,23 @@ bool touches(ScenarioVerb verb) {
            verb == ScenarioVerb::Tick;
 }
 
+QString deed(ScenarioVerb verb) {
+    switch (verb) {
+    case ScenarioVerb::Hold:
+        return u"hold"_s;
+    case ScenarioVerb::Drag:
+        return u"drag"_s;
+    case ScenarioVerb::Type:
+        return u"type into"_s;
+    case ScenarioVerb::Choose:
+        return u"choose from"_s;
+    case ScenarioVerb::Tick:
+        return u"tick"_s;
+    default:
+        return u"press"_s;
+    }
+}
+
 QString quoted(const QString& text) {
     QString shown = text;
     shown.replace(u'\\', u"\\\\"_s).replace(u'\n', u"\\n"_s);
@@ -133,7 +150,8 @@ void ScenarioPlayer::touch(const ScenarioCommand& command) {
     m_program.window().renderNow();
     const Result<void> touched = use(command);
     if (!touched)
-        fail(here, u"%1.%2 in reach"_s.arg(command.page, command.control), touched.failure().message);
+        fail(u"%1: the line wants to %2 %3.%4, but %5"_s.arg(here, deed(command.verb), command.page, command.control,
+                                                             touched.failure().message));
 }
 
 Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
@@ -310,8 +328,12 @@ QString ScenarioPlayer::place() const {
 }
 
 void ScenarioPlayer::fail(const QString& where, const QString& wanted, const QString& found) {
+    fail(u"%1: wanted %2, found %3"_s.arg(where, wanted, found));
+}
+
+void ScenarioPlayer::fail(const QString& sentence) {
     if (m_failure.isEmpty())
-        m_failure = u"%1: wanted %2, found %3"_s.arg(where, wanted, found);
+        m_failure = sentence;
     finish();
 }
 

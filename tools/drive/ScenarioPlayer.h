@@ -65,6 +65,7 @@ private:
     void moveOn();
     QString place() const;
     void fail(const QString& place, const QString& wanted, const QString& found);
+    void fail(const QString& sentence);
     void finish();
 
     Program& m_program;

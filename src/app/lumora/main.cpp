@@ -1,5 +1,6 @@
 #include "app/Program.h"
 #include "imaging/PictureMemory.h"
+#include "session/lab/LabFile.h"
 #include "views/window/Application.h"
 #include "views/window/StartFailure.h"
 
@@ -8,6 +9,8 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <cstdlib>
+#include <iterator>
 
 using namespace lumora;
 using namespace Qt::StringLiterals;
@@ -17,6 +20,37 @@ namespace {
 // Exit statuses.
 constexpr int notStarted = 2;
 constexpr int alreadyRunning = 3;
+
+// Qt ends a program that finds no screen by abort(), after lines about its plugins.
+void tellNoScreen(QtMsgType type, const QMessageLogContext& context, const QString& text) {
+    if (type != QtFatalMsg) {
+        if (qstrncmp(context.category, "qt.qpa", 6) != 0)
+            std::fprintf(stderr, "%s\n", qPrintable(text));
+        return;
+    }
+    const QByteArray screens[] = {qgetenv("WAYLAND_DISPLAY"), qgetenv("DISPLAY"), qgetenv("QT_QPA_PLATFORM")};
+    if (std::all_of(std::begin(screens), std::end(screens), [](const QByteArray& name) { return name.isEmpty(); }))
+        std::fputs("lumora: there is no screen to show the pages on: neither DISPLAY nor WAYLAND_DISPLAY is set.\n",
+                   stderr);
+    else
+        std::fprintf(stderr,
+                     "lumora: the screen to show the pages on does not answer (WAYLAND_DISPLAY=%s, DISPLAY=%s, "
+                     "QT_QPA_PLATFORM=%s).\n",
+                     screens[0].constData(), screens[1].constData(), screens[2].constData());
+    std::fflush(stderr);
+    _Exit(notStarted);
+}
+
+QString labFileHelp() {
+    QString text =
+        u"\nThe lab's settings are in lab.ini. Without --lab the first of these files is read that is there, and "
+        "without any the built-in values hold:\n"_s;
+    const std::vector<HostPath> places = labFilePlaces(toHostPath(QCoreApplication::applicationDirPath()));
+    const std::optional<HostPath> found = FindLabFile(places);
+    for (const HostPath& place : places)
+        text += u"  %1%2\n"_s.arg(toText(place), place == found ? u" (is there)"_s : QString());
+    return text;
+}
 
 } // namespace
 
@@ -28,7 +62,9 @@ int main(int argc, char** argv) {
     };
     if (std::any_of(argv + 1, argv + argc, asksForHelp))
         qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QtMessageHandler usual = qInstallMessageHandler(tellNoScreen);
     Application application(argc, argv);
+    qInstallMessageHandler(usual);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
     QCommandLineParser parser;
     parser.setApplicationDescription(u"Orders prints from a photo lab."_s);
@@ -46,7 +82,7 @@ int main(int argc, char** argv) {
         return notStarted;
     }
     if (parser.isSet(help)) {
-        std::fputs(qPrintable(parser.helpText()), stdout);
+        std::fputs(qPrintable(parser.helpText() + labFileHelp()), stdout);
         return 0;
     }
     if (parser.isSet(version)) {

@@ -43,14 +43,22 @@ QString IniReader::takeLine(const QString& line, const Taker& take) {
 }
 
 QString IniReader::takeSection(const QString& line) {
-    const QString name = line.mid(1, line.size() - 2).trimmed();
+    const qsizetype bracket = line.indexOf(u']');
+    const QString name = line.mid(1, bracket < 0 ? -1 : bracket - 1).trimmed();
     QStringList sections;
     for (const Key& key : m_keys) {
         if (!sections.contains(key.section))
             sections += key.section;
     }
-    m_sectionFailed = !line.endsWith(u']') || !sections.contains(name);
+    const bool whole = bracket == line.size() - 1;
+    m_sectionFailed = !whole || !sections.contains(name);
     m_section = m_sectionFailed ? QString() : name;
+    if (bracket < 0)
+        return u"the section %1 lacks its closing bracket; allowed: a section's name in brackets, as in [Server]"_s.arg(
+            shown(name));
+    if (!whole)
+        return u"more stands behind the closing bracket of the section %1; allowed: nothing, a comment takes a line of its own"_s
+            .arg(shown(name));
     return m_sectionFailed ? u"the section %1 is not known; allowed: [%2]"_s.arg(shown(name), sections.join(u"], ["_s))
                            : QString();
 }
