@@ -12,7 +12,7 @@ F = collections.namedtuple('F', 'old new harm seen told', defaults=(False, ''))
 SUITES = {
     'common': ('common', 'order', 'session', 'platform', 'finished', 'assembly', 'torture', 'scenarios'),
     'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
-    'platform': ('platform', 'session', 'order', 'finished', 'integration_mail', 'transfer', 'internet', 'scenarios'),
+    'platform': ('platform', 'internet', 'session', 'order', 'finished', 'integration_mail', 'transfer', 'scenarios'),
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
     'editing': ('editing', 'selection', 'assembly', 'scenarios', 'views'), 'selection': ('selection', 'scenarios', 'views'),

@@ -318,6 +318,15 @@ TEST_F(FtpTest, FailsAPutWhateverBreaksIt) {
     }
 }
 
+// That file opens, and can't be read at its beginning.
+TEST_F(FtpTest, BreaksThePutOfAFileThatCantBeReadOn) {
+    auto ftp =
+        take(internet.connectFtp(lab.ftpHost(), LabServers::user(), LabServers::password(), DataChannel::Passive));
+    EXPECT_TRUE(ftp->setCurrentDirectory(u"zalamim234"_s));
+    EXPECT_FALSE(ftp->put("/proc/self/mem", u"x.jpp"_s));
+    EXPECT_TRUE(lab.ftpLog().contains("FTP response: Client \"127.0.0.1\", \"426 ")) << lab.ftpLog().toStdString();
+}
+
 TEST_F(FtpTest, ReadsRepliesOfManyLinesThatComeLate) {
     relay.set("EACH 999 lambda session, line: time.sleep(0.03) or session.forward(line, answer=many_lines)");
     auto ftp = connect();
