@@ -196,8 +196,7 @@ FAULTS = {
         F('numbers[4] * 256 + numbers[5]', 'numbers[4] + numbers[5] * 256', 'no file goes where EPSV is not known'),
         F('reply.code == 0 || reply.code == code', 'true', 'a reply of several lines is cut', seen=True),
         F('direction == Direction::Up ? endOfPut(data.socket) : noFailure()', 'noFailure()', 'a cut behind the last bytes counts as sent', seen=True),
-        F('data.setLinger(true, 0);', '', 'a part of a file that can not be read on counts as the whole',
-          told='the put fails in either case; a server keeps what it has, and only its own log tells the reset'),
+        F('data.setLinger(true, 0);', '', 'a part of a file that can not be read on counts as the whole'),
         F('reason.code >= 400 ? refused(reason) : cut', 'cut', 'a full disk is told as a bad line'),
         F('reply.code == 213 && known && bytes >= 0 ? Length(bytes) : Length()', 'Length()', 'SIZE tells nothing'),
         F('m_home + directory', 'directory', 'orders land in another folder'),
@@ -282,8 +281,7 @@ FAULTS = {
           'fair pictures are called coarse'),
         F('record.isEmpty() ? EditRecord::newPicture() : record', 'EditRecord::newPicture()', 'a zoomed picture is not told to be coarse')],
     'src/selection/SeenPages.cpp': [
-        F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty',
-          told='the reading position does not go behind the last line'),
+        F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty'),
         F('m_state.Careful && start + cellsOfPage >= lines', 'false', 'one of many chosen pictures is shown')],
     'src/selection/HomeAddress.cpp': [F('m_state.BranchChoice == home', 'false', 'prints are to be delivered nowhere')],
     'src/selection/pictures/kyoskNewFinish.cpp': [

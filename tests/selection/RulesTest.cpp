@@ -165,20 +165,24 @@ TEST(AChoice, ofTheWholeFolderKeepsCopiesAndKnowsTheEnglishWordsCarefully) {
     }
 }
 
-// n next, p previous, c the chosen alone, a one picture alone; then the first picture and the number of pictures of the
-// page.
+// n next, p previous, c the chosen alone, a one picture alone, x nothing chosen behind the fifth; then the first
+// picture and the number of pictures of the page.
 TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
     const struct {
         bool careful;
         const char* presses;
         QString first;
         int count;
-    } cases[] = {{false, "nnn", u"40"_s, 1},  {true, "nnn", u"37"_s, 4},   {false, "nnp", u"16"_s, 12},
-                 {true, "nnp", u"25"_s, 12},  {true, "nnpp", u"13"_s, 12}, {true, "pp", u"01"_s, 12},
-                 {false, "ccc", u"14"_s, 1},  {true, "cc", u"13"_s, 2},    {true, "ccc", u"01"_s, 12},
-                 {true, "cccp", u"13"_s, 12}, {true, "ccp", u"01"_s, 12},  {true, "ncp", u"25"_s, 12},
-                 {true, "cnp", u"01"_s, 12},  {true, "na", u"07"_s, 1},    {true, "nap", u"25"_s, 12},
-                 {true, "naapp", u"13"_s, 12}};
+    } cases[] = {{false, "nnn", u"40"_s, 1},   {true, "nnn", u"37"_s, 4},   {false, "nnp", u"16"_s, 12},
+                 {true, "nnp", u"25"_s, 12},   {true, "nnpp", u"13"_s, 12}, {true, "pp", u"01"_s, 12},
+                 {false, "ccc", u"14"_s, 1},   {true, "cc", u"13"_s, 2},    {true, "ccc", u"01"_s, 12},
+                 {true, "cccp", u"13"_s, 12},  {true, "ccp", u"01"_s, 12},  {true, "ncp", u"25"_s, 12},
+                 {true, "cnp", u"01"_s, 12},   {true, "na", u"07"_s, 1},    {true, "nap", u"25"_s, 12},
+                 {true, "naapp", u"13"_s, 12}, {true, "ccnxp", u"01"_s, 5}};
+    const auto keepFive = [](PictureChoice& choice) {
+        while (choice.basket().count() > 5)
+            choice.remove(BasketLine::split(choice.basket().lines().items().back(), LineForm::Short).path.text());
+    };
     for (const auto& c : cases) {
         Choosing at;
         at.state.Careful = c.careful;
@@ -194,6 +198,7 @@ TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
         for (const char press : std::string_view(c.presses))
             press == 'n'   ? at.choice.nextPage()
             : press == 'p' ? at.choice.previousPage()
+            : press == 'x' ? keepFive(at.choice)
             : press == 'a' ? at.choice.showAlone({u"C:\\p\\07.jpg"_s})
                            : at.choice.chosenPage();
         EXPECT_EQ(at.choice.path(0), u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
