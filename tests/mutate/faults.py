@@ -11,7 +11,7 @@ F = collections.namedtuple('F', 'old new harm seen told', defaults=(False, ''))
 # What a floor's faults are played against: the tests of the floor, then further ones, the quick ones first.
 SUITES = {
     'common': ('common', 'order', 'session', 'platform', 'finished', 'assembly', 'torture', 'scenarios'),
-    'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
+    'door': ('door', 'selection'), 'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
     'platform': ('platform', 'internet', 'session', 'order', 'finished', 'integration_mail', 'transfer', 'scenarios'),
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
@@ -294,6 +294,61 @@ FAULTS = {
         F('StoredSmallView::discard(m_state, m_platform.files, DrivePath(path));', '', 'a picture shows edits that it no longer has'),
         F('UnpackEditState(record.value_or(EditRecord::newPicture()), m_state.edit);', 'UnpackEditState(EditRecord::newPicture(), m_state.edit);',
           'a picture chosen again loses its edits')],
+
+    'src/selection/pictures/kyoskNewDoor.cpp': [
+        F('m_choice.remove(path);', '', 'a picture that can not be printed stays in the order'),
+        F('m_wait.takeOut(shownPath(path).leaf());', '', 'a picture is taken out of the order and nobody is told')],
+    'src/selection/SmallPictures.cpp': [
+        F('u"%1|%2|%3|"_s.arg(cell).arg(length).arg(time)', 'u"%1|"_s.arg(cell)', 'a cell shows the picture of an earlier card')],
+    'src/selection/door/DoorNames.cpp': [
+        F('taken.contains(made.toCaseFolded())', 'false', 'two pictures get one name, and one of them is printed twice'),
+        F('AnsiCodePage::holds(name)', 'true', 'a picture is left out for the letters of its name')],
+    'src/selection/door/DoorWait.cpp': [
+        F('m_waits = m_waiting > 0;', 'm_waits = false;', 'the order goes on before its pictures are made'),
+        F('m_notMade.isEmpty() ? Then::GoOn : Then::TellNotMade', 'Then::GoOn', 'the order goes on without what the disk has not taken'),
+        F('!std::exchange(m_toldAtOnce, true)', 'true', 'a full disk opens a box for each picture')],
+    'src/selection/door/PictureDoor.cpp': [
+        F('!std::filesystem::exists(file, none) || stampOf(file).time == stampOf(source).time', 'true',
+          'the picture of an earlier card is printed in the place of this one'),
+        F('known && stampOf(known->source) == known->stamp', 'known != nullptr', 'a picture of another card is taken for the one before'),
+        F('picture && picture->state == State::NotMade', 'false', 'what a full disk has not taken is never tried again'),
+        F('isThePictures(made.failure()) ? State::Unreadable : State::NotMade', 'State::Unreadable',
+          'a full disk takes whole pictures out of the order'),
+        F('m_isKept && m_isKept(picture.worked)', 'false', 'a chosen picture goes to make room'),
+        F('!untold && std::filesystem::last_write_time(source, passedOver) == time', 'false', 'each visit of a page makes its pictures again')],
+
+    'src/door/DoorDecoder.cpp': [
+        F('readPart(file, size - 2, 2, error) == "\\xFF\\xD9"', 'true', 'half a picture of a decoder that died is printed'),
+        F('doorNeedOf(*header, u".jpg"_s) == DoorNeed::Nothing', 'true', 'what a decoder that was taken over writes is believed'),
+        F('failure.kind = Failure::Kind::NotFound;', '', 'a card that breaks is told as a fault that nobody knows'),
+        F('full ? Failure::Kind::NoSpace : Failure::Kind::Other', 'Failure::Kind::Other', 'nobody learns that the disk is full')],
+    'src/door/DoorNeed.cpp': [
+        F('rules.srgb && coloursOf(header).source != Source::None', 'false', 'a picture of other colours is printed pale'),
+        F('rules.upright && header.orientation != 1', 'false', 'a picture lies on its side'),
+        F('fileName.endsWith(u".jpg"_s) || fileName.endsWith(u".JPG"_s)', 'true', 'a picture is left out for its ending'),
+        F('broken = true;', '', 'nobody learns that a broken profile was left aside')],
+    'src/door/PictureHeader.cpp': [
+        F('value >= 1 && value <= 8 ? value : 1', 'value', 'an orientation that there is not turns a picture'),
+        F('m_broken || static_cast<int>(m_parts.size()) != m_total || m_parts.rbegin()->first != m_total', 'false', 'half a profile is used')],
+    'src/door/ProfileJudge.cpp': [
+        F('std::abs(encodedSrgb(*light) - value) <= tolerance', 'true', 'sRGB lights with another curve are printed too dark')],
+    'src/door/StoredPicture.cpp': [
+        F('width * height > maxDoorPixels', 'false', 'a picture of more than 100 million pixels is decoded'),
+        F('m_kind == PictureKind::Gif && !hasWholeGifFrame(m_bytes)', 'false', 'a GIF that was cut short is printed'),
+        F('picture.colours = byProfile;', '', 'a HEIC of P3 is printed pale'),
+        F('isWide(handle) == isWide(picture)', 'true', 'a draft lies on its side', told='only until the picture itself is there'),
+        F('reader.setAutoTransform(m_kind == PictureKind::Tiff);', 'reader.setAutoTransform(false);', 'a TIFF lies on its side')],
+    'src/door/UprightJpeg.cpp': [
+        F('TJXOPT_PERFECT | TJXOPT_COPYNONE', 'TJXOPT_COPYNONE', 'a turned picture has a strip of its other side at an edge'),
+        F('picture = upright(std::move(picture), stored.orientation);', '', 'a PNG lies on its side'),
+        F('conversion && conversion->fits(picture.image)', 'false', 'no colours are converted')],
+    'src/platform/media/CardSummary.cpp': [
+        F("name.startsWith(u'.')", 'false', 'hidden files count as pictures'),
+        F('of->number > known->second.first', 'of->number < known->second.first', 'the card opens at its oldest pictures'),
+        F('m_stop || ++m_entries > mostEntries', 'false', 'a damaged card is counted without an end')],
+    'src/platform/media/MediaFolders.cpp': [
+        F('m_told && media == m_last', 'false', 'the page draws its cards anew each second'),
+        F('m_isMounted(folder)', 'true', 'a folder that is no card is offered')],
 
     'src/entry/album/AlbumCheck.cpp': [
         F('album.SoogLBM == notChosen', 'false', 'an album without a kind is ordered'),
