@@ -239,8 +239,8 @@ QByteArray heif(const QImage& picture, const HeifKind& kind) {
     heif_context* context = heif_context_alloc();
     heif_encoder* encoder = nullptr;
     heif_context_get_encoder_for_format(context, kind.avif ? heif_compression_AV1 : heif_compression_HEVC, &encoder);
-    heif_encoder_set_lossy_quality(encoder, 95);
-    heif_encoder_set_parameter(encoder, "chroma", "444");
+    heif_encoder_set_lossy_quality(encoder, kind.quality);
+    heif_encoder_set_parameter(encoder, "chroma", kind.chroma);
     heif_encoding_options* options = heif_encoding_options_alloc();
     options->image_orientation = static_cast<heif_orientation>(kind.orientation);
     options->macOS_compatibility_workaround_no_nclx_profile = 0;
@@ -249,6 +249,11 @@ QByteArray heif(const QImage& picture, const HeifKind& kind) {
         options->output_nclx_profile = coded;
     heif_image_handle* handle = nullptr;
     heif_context_encode_image(context, image, encoder, options, &handle);
+    if (kind.small > 0) {
+        heif_image_handle* small = nullptr;
+        heif_context_encode_thumbnail(context, image, handle, encoder, options, kind.small, &small);
+        heif_image_handle_release(small);
+    }
     if (!kind.exif.isEmpty())
         heif_context_add_exif_metadata(context, handle, kind.exif.constData(), static_cast<int>(kind.exif.size()));
     heif_writer writer{1, [](heif_context*, const void* data, std::size_t size, void* target) {
@@ -343,7 +348,7 @@ std::vector<std::pair<std::string, QByteArray>> samplePictureFiles() {
         {"lossy.webp", saved(picture, "WEBP", 80)},
         {"plain.tiff", saved(picture, "TIFF")},
         {"two.gif", gif(picture)},
-        {"p3.heic", heif(picture, {.profile = p3Profile(), .orientation = 6})},
+        {"p3.heic", heif(picture, {.profile = p3Profile(), .orientation = 6, .small = 32})},
         {"alpha.heic", heif(alpha, {})},
         {"plain.avif", heif(picture, {.avif = true, .codes = {{12, 13}}})},
     };

@@ -36,6 +36,9 @@ struct HeifKind {
     std::optional<std::pair<int, int>> codes = {};
     int orientation = 1;
     QByteArray exif = {};
+    int small = 0; // the longer side of a second, small picture
+    int quality = 95;
+    const char* chroma = "444";
 };
 QByteArray heif(const QImage& picture, const HeifKind& kind);
 

@@ -8,6 +8,8 @@
 namespace lumora {
 
 inline constexpr std::string_view doorChildOption = "--child";
+// In its place: makes the draft alone.
+inline constexpr std::string_view doorDraftOption = "--draft";
 inline constexpr int doorSourceNumber = 3;
 inline constexpr int doorTargetNumber = 4;
 

@@ -11,6 +11,7 @@
 #include <cerrno>
 #include <chrono>
 #include <string>
+#include <string_view>
 #include <utility>
 
 #include <fcntl.h>
@@ -98,6 +99,7 @@ Descriptor above(int number) {
     return Descriptor(::fcntl(number, F_DUPFD_CLOEXEC, doorTargetNumber + 1));
 }
 
+constexpr qint64 largestDraftFile = 4 << 20;
 constexpr qint64 betweenLooks = 100; // milliseconds, for a stop
 
 // A child, killed at the latest when this goes.
@@ -115,9 +117,10 @@ public:
     }
 
     // Gives an errno, or 0.
-    int start(const std::filesystem::path& program, const DoorLimits& limits, int source, int target) {
+    int start(const std::filesystem::path& program, std::string_view task, const DoorLimits& limits, int source,
+              int target) {
         std::string path = program.string();
-        std::string option(doorChildOption);
+        std::string option(task);
         std::string seconds = std::to_string(limits.seconds);
         std::string memory = std::to_string(limits.memory);
         std::string parent = std::to_string(::getpid());
@@ -237,11 +240,12 @@ struct Decoded {
     bool profileIgnored;
 };
 
-Result<Decoded> decoded(const std::filesystem::path& program, const DoorLimits& limits, const Descriptor& file,
-                        const std::filesystem::path& source, const std::stop_token& stop) {
+Result<Decoded> decoded(const std::filesystem::path& program, std::string_view task, const DoorLimits& limits,
+                        const Descriptor& file, const std::filesystem::path& source, const std::stop_token& stop) {
     Descriptor made(::memfd_create("picture", MFD_CLOEXEC));
     Child child;
-    if (const int error = made.valid() ? child.start(program, limits, file.number(), made.number()) : errno; error != 0)
+    if (const int error = made.valid() ? child.start(program, task, limits, file.number(), made.number()) : errno;
+        error != 0)
         return Failure{Failure::Kind::NoProgram, fileFailure(program, u"can't be started"_s, error).message};
     int status = 0;
     const int error = child.ended(limits.seconds, stop, status);
@@ -282,7 +286,7 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
         return need.failure();
     const bool copied = *need == DoorNeed::Nothing || *need == DoorNeed::Copy;
     auto picture = copied ? Decoded{Descriptor(), coloursOf(*header).profileIgnored}
-                          : decoded(m_program, m_limits, *file, source, stop);
+                          : decoded(m_program, doorChildOption, m_limits, *file, source, stop);
     if (!picture)
         return picture.failure();
     NewContent content(target, shownPath(target));
@@ -294,6 +298,21 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
         return Failure{full ? Failure::Kind::NoSpace : Failure::Kind::Other, written.failure().message};
     }
     return Made{picture->profileIgnored};
+}
+
+Result<QByteArray> DoorDecoder::draft(const std::filesystem::path& source, const std::stop_token& stop) const {
+    const auto file = openSource(source, shownPath(source));
+    const auto header = file ? headerOf(*file, source) : file.failure();
+    if (!header)
+        return ofSource(header.failure());
+    if (header->kind != PictureKind::Heif && header->kind != PictureKind::Avif)
+        return pictureFailure(source, Failure::Kind::Unsupported, u"has no small picture"_s);
+    const auto picture = decoded(m_program, doorDraftOption, m_limits, *file, source, stop);
+    if (!picture)
+        return picture.failure();
+    int error = 0;
+    const qint64 size = ::lseek(picture->file.number(), 0, SEEK_END);
+    return readPart(picture->file, 0, std::min(size, largestDraftFile), error);
 }
 
 } // namespace lumora

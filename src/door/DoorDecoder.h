@@ -31,6 +31,10 @@ public:
     Result<Made> make(const std::filesystem::path& source, const std::filesystem::path& target,
                       const std::stop_token& stop = {}) const;
 
+    // The small picture that a HEIC or AVIF file carries beside its own, as an upright JPEG file in sRGB; Unsupported
+    // where there is none.
+    Result<QByteArray> draft(const std::filesystem::path& source, const std::stop_token& stop = {}) const;
+
 private:
     std::filesystem::path m_program;
     DoorLimits m_limits;

@@ -49,4 +49,13 @@ Bitmap pictureDraft(const std::filesystem::path& path, int cell, Held held) {
     return held == Held::Upright ? upright(std::move(draft), header->orientation) : draft;
 }
 
+Bitmap pictureDraft(const QByteArray& jpeg, int cell) {
+    const QImage small = smallPicture(jpeg);
+    if (small.isNull())
+        return {};
+    const PictureSize size = smallPictureSize({small.width(), small.height()}, cell);
+    return Bitmap(small.scaled(size.width, size.height, Qt::IgnoreAspectRatio, Qt::SmoothTransformation)
+                      .convertToFormat(QImage::Format_RGB32));
+}
+
 } // namespace lumora

@@ -11,5 +11,7 @@ namespace lumora {
 // Programs that change a picture may leave an old one there. Reads the header alone.
 enum class Held { AsStored, Upright };
 Bitmap pictureDraft(const std::filesystem::path& path, int cell, Held held);
+// The same of a small JPEG file that stands upright; null where it is damaged or not small.
+Bitmap pictureDraft(const QByteArray& small, int cell);
 
 } // namespace lumora

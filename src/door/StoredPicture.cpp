@@ -18,6 +18,7 @@ namespace lumora {
 namespace {
 
 constexpr qint64 maxFile = 256 << 20;
+constexpr int largestDraft = 1024;
 
 const char* qtNameOf(PictureKind kind) {
     switch (kind) {
@@ -47,7 +48,7 @@ void releaseImage(const heif_image* image) {
     heif_image_release(image);
 }
 
-void releasePrimary(const heif_image_handle* handle) {
+void releaseHandle(const heif_image_handle* handle) {
     heif_image_handle_release(handle);
 }
 
@@ -71,6 +72,23 @@ DoorStatus statusOfSize(qint64 width, qint64 height) {
     if (const auto bounds = checkPictureBounds({}, width, height); !bounds)
         return doorStatusOf(bounds.failure());
     return width * height > maxDoorPixels ? DoorStatus::TooLarge : DoorStatus::Done;
+}
+
+// The embedded picture; null where there is none, or it is turned in another way.
+Handle<const heif_image_handle, releaseHandle> draftOf(const heif_image_handle* picture) {
+    heif_item_id id = 0;
+    heif_image_handle* handle = nullptr;
+    if (heif_image_handle_get_list_of_thumbnail_IDs(picture, &id, 1) == 1)
+        (void)heif_image_handle_get_thumbnail(picture, id, &handle);
+    Handle<const heif_image_handle, releaseHandle> draft(handle);
+    if (!draft)
+        return {};
+    const auto isWide = [](const heif_image_handle* one) {
+        return heif_image_handle_get_width(one) > heif_image_handle_get_height(one);
+    };
+    const bool fits = heif_image_handle_get_width(handle) <= largestDraft &&
+                      heif_image_handle_get_height(handle) <= largestDraft && isWide(handle) == isWide(picture);
+    return fits ? std::move(draft) : Handle<const heif_image_handle, releaseHandle>();
 }
 
 HeaderColours heifColours(const heif_image_handle* handle) {
@@ -157,7 +175,7 @@ DoorStatus StoredPictureReader::read(StoredPicture& picture) {
         return readJpeg(picture);
     case PictureKind::Heif:
     case PictureKind::Avif:
-        return readHeif(picture);
+        return readHeif(picture, Part::Whole);
     case PictureKind::Bmp: {
         auto bitmap = readOtherPicture(*m_input);
         if (!bitmap)
@@ -189,7 +207,12 @@ DoorStatus StoredPictureReader::readJpeg(StoredPicture& picture) {
     return DoorStatus::Done;
 }
 
-DoorStatus StoredPictureReader::readHeif(StoredPicture& picture) {
+DoorStatus StoredPictureReader::readDraft(StoredPicture& picture) {
+    const bool mayHaveOne = m_kind == PictureKind::Heif || m_kind == PictureKind::Avif;
+    return mayHaveOne ? readHeif(picture, Part::Draft) : DoorStatus::Unsupported;
+}
+
+DoorStatus StoredPictureReader::readHeif(StoredPicture& picture, Part part) {
     const Handle<heif_context, heif_context_free> context(heif_context_alloc());
     heif_context_set_max_decoding_threads(context.get(), 0);
     heif_error error = heif_context_read_from_memory_without_copy(context.get(), m_bytes.constData(),
@@ -200,7 +223,7 @@ DoorStatus StoredPictureReader::readHeif(StoredPicture& picture) {
     error = heif_context_get_primary_image_handle(context.get(), &handle);
     if (error.code != heif_error_Ok)
         return statusOf(error);
-    const Handle<const heif_image_handle, releasePrimary> handleOwner(handle);
+    const Handle<const heif_image_handle, releaseHandle> handleOwner(handle);
     if (const DoorStatus size = statusOfSize(heif_image_handle_get_width(handle), heif_image_handle_get_height(handle));
         size != DoorStatus::Done)
         return size;
@@ -219,17 +242,24 @@ DoorStatus StoredPictureReader::readHeif(StoredPicture& picture) {
         else
             picture.colours = byProfile;
     }
+    Handle<const heif_image_handle, releaseHandle> draft;
+    if (part == Part::Draft) {
+        draft = draftOf(handle);
+        if (!draft)
+            return DoorStatus::Unsupported;
+    }
+    const heif_image_handle* drawn = draft ? draft.get() : handle;
     const Handle<heif_decoding_options, heif_decoding_options_free> options(heif_decoding_options_alloc());
     options->convert_hdr_to_8bit = 1;
     heif_image* decoded = nullptr;
-    error = heif_decode_image(handle, &decoded, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, options.get());
+    error = heif_decode_image(drawn, &decoded, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, options.get());
     if (error.code != heif_error_Ok)
         return statusOf(error);
     const Handle<const heif_image, releaseImage> image(decoded);
     int stride = 0;
     const uchar* pixels = heif_image_get_plane_readonly(decoded, heif_channel_interleaved, &stride);
-    const QImage::Format format = heif_image_handle_has_alpha_channel(handle) == 0 ? QImage::Format_RGBX8888
-                                  : heif_image_handle_is_premultiplied_alpha(handle) != 0
+    const QImage::Format format = heif_image_handle_has_alpha_channel(drawn) == 0 ? QImage::Format_RGBX8888
+                                  : heif_image_handle_is_premultiplied_alpha(drawn) != 0
                                       ? QImage::Format_RGBA8888_Premultiplied
                                       : QImage::Format_RGBA8888;
     const QImage view(pixels, heif_image_get_width(decoded, heif_channel_interleaved),

@@ -33,12 +33,15 @@ public:
     const PictureHeader& header();
     // Done, or why there is no picture. One call uses the reader up.
     DoorStatus read(StoredPicture& picture);
+    // The small picture that a HEIC or AVIF file carries beside its own; Unsupported where there is none.
+    DoorStatus readDraft(StoredPicture& picture);
 
 private:
     StoredPictureReader() = default;
 
     DoorStatus readJpeg(StoredPicture& picture);
-    DoorStatus readHeif(StoredPicture& picture);
+    enum class Part { Whole, Draft };
+    DoorStatus readHeif(StoredPicture& picture, Part part);
     DoorStatus readByQt(StoredPicture& picture);
 
     QByteArray m_bytes;

@@ -152,4 +152,13 @@ DoorStatus makeUprightJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
     return done(stored.colours.profileIgnored);
 }
 
+DoorStatus makeDraftJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
+    StoredPicture stored;
+    if (const DoorStatus read = reader.readDraft(stored); read != DoorStatus::Done)
+        return read;
+    const Bitmap picture = onWhite(Bitmap(inSrgb(stored)));
+    jpeg = picture.isNull() ? QByteArray() : encoded(picture.image(), smallQuality);
+    return jpeg.isEmpty() ? DoorStatus::TooLarge : DoorStatus::Done;
+}
+
 } // namespace lumora

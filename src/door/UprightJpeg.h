@@ -11,4 +11,7 @@ namespace lumora {
 // only tag is the place of the small picture. Done or ProfileIgnored, or why there is none.
 DoorStatus makeUprightJpeg(StoredPictureReader& reader, QByteArray& jpeg);
 
+// The same of the small picture that a HEIC or AVIF file carries beside its own; Unsupported where there is none.
+DoorStatus makeDraftJpeg(StoredPictureReader& reader, QByteArray& jpeg);
+
 } // namespace lumora

@@ -311,6 +311,19 @@ TEST_F(DoorTest, TheSmallPictureInTheHeaderIsFoundAndWritten) {
     expectColours(saved(drawn, "JPG"), labOf({}, middlesOf(patches(320, 240))));
 }
 
+TEST_F(DoorTest, ADraftIsTheSmallPictureOfTheFileUprightAndInSrgb) {
+    const QImage picture = patches(256, 192);
+    for (const bool avif : {false, true}) {
+        const HeifKind kind{.avif = avif, .profile = p3Profile(), .orientation = 6, .small = 128};
+        const auto draft = m_decoder.draft(write("source", heif(heldFor(picture, 6), kind)));
+        ASSERT_TRUE(draft);
+        EXPECT_EQ(QImage::fromData(*draft).size(), QSize(128, 96));
+        expectColours(*draft, labOf(p3Profile(), middlesOf(picture)));
+    }
+    for (const QByteArray& without : {heif(picture, {}), saved(picture, "PNG")})
+        EXPECT_EQ(m_decoder.draft(write("source", without)).failure().kind, Failure::Kind::Unsupported);
+}
+
 TEST_F(DoorTest, FilesThatAreCutShortAreDamagedAndLeaveNothing) {
     for (const auto& [name, file] : samplePictureFiles()) {
         for (const int percent : {30, 60, 95}) {
@@ -348,6 +361,8 @@ TEST_F(DoorTest, DamagedFilesGiveAWholePictureOrAFailureAndNothingElse) {
         fs::remove(in("target.jpg"));
         const auto result = make(damaged(whole, random), m_decoder);
         EXPECT_EQ(fs::exists(in("target.jpg")), result.ok());
+        const auto draft = m_decoder.draft(in("source"));
+        EXPECT_TRUE(!draft || !QImage::fromData(*draft).isNull());
         EXPECT_EQ(std::distance(fs::directory_iterator(in("")), fs::directory_iterator()), result ? 2 : 1);
         if (result && *DoorDecoder::needOf(in("source")) >= DoorNeed::Turn) {
             EXPECT_TRUE(checkJpegDecodes(in("target.jpg")));

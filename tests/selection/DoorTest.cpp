@@ -45,7 +45,7 @@ protected:
         const QByteArray turned = jpegWith(jpeg, exif(6, false, saved(patches(16, 12), "JPG")), "broken");
         put(u"b.jpg"_s, turned);
         put(u"café.jpg"_s, jpeg);
-        put(u"d.heic"_s, heif(picture, {}));
+        put(u"d.heic"_s, heif(picture, {.small = 32}));
         put(u"e.jpg"_s, turned.left(turned.size() * 7 / 10));
         put(u"f.txt"_s, "no picture");
         put(u"g.webp"_s, "empty");
@@ -84,9 +84,13 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     EXPECT_TRUE(shown.Picture1[3].waiting) << "its turn comes while the customer looks";
     for (const std::size_t draft : {1, 4})
         EXPECT_GT(shown.Picture1[draft].bitmap.height(), shown.Picture1[draft].bitmap.width()) << draft;
+    bool drafted = false;
+    QObject::connect(&page, &Page::changed,
+                     [&] { drafted = drafted || (shown.Picture1[3].waiting && !shown.Picture1[3].bitmap.isNull()); });
     EXPECT_EQ(shown.Picture1[5].unreadable, u"a kind of file that can't be shown"_s) << "told by its header";
     waitForCells(page);
     const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.jpg"_s, u"g.webp"_s};
+    EXPECT_TRUE(drafted) << "its small picture comes before it";
     const std::string warned = testing::internal::GetCapturedStderr();
     EXPECT_NE(warned.find("lumora: b.jpg: its colour profile is broken and was ignored\n"), warned.npos) << warned;
     for (std::size_t cell = 0; cell < 6; ++cell) {

@@ -177,10 +177,16 @@ Failure PictureDoor::failureOf(const QString& worked) const {
     return picture ? picture->failure : Failure();
 }
 
-Bitmap PictureDoor::draft(const QString& worked, int cell) const {
-    const Picture* picture = find(worked);
+Bitmap PictureDoor::draft(const QString& worked, int cell) {
+    Picture* picture = find(worked);
     const HostPath source = picture ? picture->source : m_files.drives().toHost(DrivePath(worked)).value_or(HostPath());
-    return pictureDraft(source, cell, m_rules.upright ? Held::Upright : Held::AsStored);
+    const bool isWaiting = picture && picture->state == State::Waiting;
+    Bitmap draft = isWaiting && !picture->draft.isEmpty()
+                       ? pictureDraft(picture->draft, cell)
+                       : pictureDraft(source, cell, m_rules.upright ? Held::Upright : Held::AsStored);
+    if (draft.isNull() && isWaiting && !std::exchange(picture->draftAsked, true))
+        m_draftsWanted += worked;
+    return draft;
 }
 
 void PictureDoor::foundUnreadable(const QString& worked, const Failure& why) {
@@ -193,6 +199,12 @@ void PictureDoor::foundUnreadable(const QString& worked, const Failure& why) {
 
 void PictureDoor::want(const QStringList& worked) {
     m_wanted.clear();
+    // Of pages that were left.
+    m_draftsWanted.removeIf([&](const QString& path) {
+        const bool gone = !worked.contains(path);
+        find(path)->draftAsked = !gone;
+        return gone;
+    });
     QSet<QString> taken;
     for (const QString& path : worked) {
         Picture* picture = find(path);
@@ -207,6 +219,8 @@ void PictureDoor::want(const QStringList& worked) {
 }
 
 void PictureDoor::startNext() {
+    while (m_running < madeAtOnce && !m_draftsWanted.isEmpty())
+        startDraft(*find(m_draftsWanted.takeFirst()));
     while (m_running < madeAtOnce && !m_wanted.isEmpty())
         start(*find(m_wanted.takeFirst()));
 }
@@ -227,6 +241,29 @@ void PictureDoor::start(Picture& picture) {
     });
 }
 
+void PictureDoor::startDraft(const Picture& picture) {
+    ++m_running;
+    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = picture.source,
+                      stop = m_stop.get_token()] {
+        const Result<QByteArray> draft = decoder.draft(source, stop);
+        const std::lock_guard lock(desk->mutex);
+        PictureDoor* door = desk->door;
+        if (door)
+            QMetaObject::invokeMethod(
+                door, [door, worked, draft] { door->settleDraft(worked, draft); }, Qt::QueuedConnection);
+    });
+}
+
+void PictureDoor::settleDraft(const QString& worked, const Result<QByteArray>& draft) {
+    --m_running;
+    Picture& picture = *find(worked);
+    startNext();
+    if (!draft || picture.state != State::Waiting)
+        return;
+    picture.draft = *draft;
+    Q_EMIT drafted(worked);
+}
+
 // A folder that can't be made is no fault of the picture.
 Result<HostPath> PictureDoor::targetOf(const DrivePath& made) const {
     for (const DrivePath& folder : {m_folder.folder(), m_folder, made.folder()}) {
@@ -242,6 +279,7 @@ void PictureDoor::settle(const QString& worked, const Result<qint64>& made) {
     --m_running;
     Picture& picture = *find(worked);
     picture.inHand = false;
+    picture.draft.clear();
     if (made) {
         picture.state = State::Ready;
         picture.bytes = *made;

@@ -55,9 +55,10 @@ public:
     bool isWaiting(const QString& worked) const { return stateOf(worked) == State::Waiting; }
     bool isNotMade(const QString& worked) const { return stateOf(worked) == State::NotMade; }
     bool isUnreadable(const QString& worked) const { return stateOf(worked) == State::Unreadable; }
-    // The small picture that the camera has put into the header of the file, in the place of a small picture of cell
-    // pixels; null where there is none.
-    Bitmap draft(const QString& worked, int cell) const;
+    // The small picture that the camera has put into the file, in the place of a small picture of cell pixels; null
+    // where there is none. One that has to be decoded is null until drafted(), and is decoded before what is wanted
+    // next.
+    Bitmap draft(const QString& worked, int cell);
     // Why a file is unreadable or was not made.
     Failure failureOf(const QString& worked) const;
     // A file that is used in its place can't be shown. Only where all kinds of pictures are offered; as built in such
@@ -73,6 +74,8 @@ public:
 Q_SIGNALS:
     // Ready, unreadable or not made.
     void settled(const QString& worked);
+    // A picture that is waiting has a draft now.
+    void drafted(const QString& worked);
 
 private:
     // Another card may lie at the same path by now.
@@ -91,6 +94,8 @@ private:
         Failure failure;
         qint64 bytes = 0;
         bool inHand = false; // it is being made
+        bool draftAsked = false;
+        QByteArray draft; // a JPEG file, while the picture is waiting
     };
     struct Desk; // where a thread hands in its result, also when the door has gone
 
@@ -102,6 +107,8 @@ private:
     void judge(Picture& picture);
     void startNext();
     void start(Picture& picture);
+    void startDraft(const Picture& picture);
+    void settleDraft(const QString& worked, const Result<QByteArray>& draft);
     Result<HostPath> targetOf(const DrivePath& made) const;
     void settle(const QString& worked, const Result<qint64>& made);
     void makeRoom();
@@ -115,6 +122,7 @@ private:
     QHash<QString, Picture*> m_byWorked;
     QHash<QString, QHash<QString, QString>> m_names; // of each folder, by the listed name
     QStringList m_wanted;
+    QStringList m_draftsWanted;
     QStringList m_made; // the oldest first
     std::function<bool(const QString&)> m_isKept;
     int m_running = 0;

@@ -185,6 +185,7 @@ private:
     QStringList nextPictures() const;
     void orderPictures(const QStringList& next = {});
     void pictureSettled(const QString& path);
+    void showDraft(const QString& path);
     void findUnreadable(const QString& path, const Failure& why);
     void takeOutUnreadable(const QString& path);
     bool tellTakenOut();

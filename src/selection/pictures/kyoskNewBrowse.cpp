@@ -207,7 +207,6 @@ void kyoskNew::drawCells() {
 
 // What the camera has put into the header shows at once, and goes when the picture itself is drawn.
 void kyoskNew::drawDrafts() {
-    orderPictures();
     bool drawn = false;
     for (int cell = 0; cell < List2.count(); ++cell) {
         CellPicture& shown = Picture1[static_cast<std::size_t>(cell)];
@@ -217,6 +216,7 @@ void kyoskNew::drawDrafts() {
         shown.bitmap = m_door->draft(path, m_cellPixels);
         drawn = drawn || !shown.bitmap.isNull();
     }
+    orderPictures(); // drafts that have to be decoded come first
     if (!drawn)
         return;
     Q_EMIT changed();

@@ -22,6 +22,7 @@ void kyoskNew::openDoor(const HandOver& before) {
                                                                   : newDoorFolder(m_platform.files));
     m_door->setKept([this](const QString& path) { return m_choice.inBasket(path) || m_choice.page().contains(path); });
     connect(m_door.get(), &PictureDoor::settled, this, &kyoskNew::pictureSettled);
+    connect(m_door.get(), &PictureDoor::drafted, this, &kyoskNew::showDraft);
 }
 
 // The customer's own path.
@@ -86,6 +87,14 @@ void kyoskNew::pictureSettled(const QString& path) {
         stopWaiting(); // the customer looks at what is left
     else if (m_wait.waits())
         showWaiting();
+    Q_EMIT changed();
+}
+
+void kyoskNew::showDraft(const QString& path) {
+    const int cell = List2.find(path);
+    if (cell < 0 || cell >= cellsOfPage || !Picture1[static_cast<std::size_t>(cell)].bitmap.isNull())
+        return;
+    Picture1[static_cast<std::size_t>(cell)].bitmap = m_door->draft(path, m_cellPixels);
     Q_EMIT changed();
 }
 
