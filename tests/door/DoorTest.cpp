@@ -373,7 +373,7 @@ TEST_F(DoorTest, DamagedFilesGiveAWholePictureOrAFailureAndNothingElse) {
 TEST_F(DoorTest, ARefusalTellsWhyAndLeavesNothing) {
     const QByteArray png = saved(patches(1200, 900), "PNG");
     QByteArray large = saved(patches(64, 48), "BMP");
-    large.replace(18, 8, QByteArray("\x40\x9C\0\0\x40\x9C\0\0", 8));
+    large.replace(18, 8, QByteArray("\xE0\x2E\0\0\x10\x27\0\0", 8));
     expectRefused({}, Failure::Kind::Damaged, m_decoder);
     expectRefused("no picture", Failure::Kind::Unsupported, m_decoder);
     expectRefused(large, Failure::Kind::TooLarge, m_decoder);
@@ -403,7 +403,7 @@ TEST_F(DoorTest, ADecoderThatWasTakenOverDoesNoHarm) {
         {Kind::TooLarge, {"is killed", memoryIsLimited ? "eats memory" : "is killed"}},
         {Kind::Other, {"reads a file", "opens the net", "begins a process", "aborts its parent", "runs its own code"}},
         {Kind::NotFound, {"says that it read nothing"}},
-        {Kind::Damaged, {"aborts", "says done of rubbish", "says done of half"}},
+        {Kind::Damaged, {"aborts", "says done of rubbish", "says done of a PNG", "says done of half"}},
     };
     // A signal that comes again and again begins no wait anew.
     ::signal(SIGALRM, [](int) {});

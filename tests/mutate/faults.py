@@ -11,7 +11,7 @@ F = collections.namedtuple('F', 'old new harm seen told', defaults=(False, ''))
 # What a floor's faults are played against: the tests of the floor, then further ones, the quick ones first.
 SUITES = {
     'common': ('common', 'order', 'session', 'platform', 'finished', 'assembly', 'torture', 'scenarios'),
-    'door': ('door', 'selection'), 'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
+    'door': ('door', 'selection', 'torture'), 'imaging': ('imaging', 'assembly', 'editing', 'scenarios'),
     'platform': ('platform', 'internet', 'session', 'order', 'finished', 'integration_mail', 'transfer', 'scenarios'),
     'session': ('session', 'start', 'entry', 'selection', 'finished', 'assembly', 'scenarios', 'views'),
     'order': ('order', 'start', 'entry', 'selection', 'finished', 'assembly', 'editing', 'transfer', 'scenarios'),
@@ -314,6 +314,7 @@ FAULTS = {
         F('picture && picture->state == State::NotMade', 'false', 'what a full disk has not taken is never tried again'),
         F('isThePictures(made.failure()) ? State::Unreadable : State::NotMade', 'State::Unreadable',
           'a full disk takes whole pictures out of the order'),
+        F('m_draftsWanted += worked;', '', 'a page of a telephone shows clocks until its pictures are made'),
         F('m_isKept && m_isKept(picture.worked)', 'false', 'a chosen picture goes to make room'),
         F('!untold && std::filesystem::last_write_time(source, passedOver) == time', 'false', 'each visit of a page makes its pictures again')],
 
@@ -329,7 +330,8 @@ FAULTS = {
         F('broken = true;', '', 'nobody learns that a broken profile was left aside')],
     'src/door/PictureHeader.cpp': [
         F('value >= 1 && value <= 8 ? value : 1', 'value', 'an orientation that there is not turns a picture'),
-        F('m_broken || static_cast<int>(m_parts.size()) != m_total || m_parts.rbegin()->first != m_total', 'false', 'half a profile is used')],
+        F('m_broken || static_cast<int>(m_parts.size()) != m_total || m_parts.rbegin()->first != m_total', 'false', 'half a profile is used',
+          told='its stated length tells that it is not whole')],
     'src/door/ProfileJudge.cpp': [
         F('std::abs(encodedSrgb(*light) - value) <= tolerance', 'true', 'sRGB lights with another curve are printed too dark')],
     'src/door/StoredPicture.cpp': [
@@ -347,7 +349,8 @@ FAULTS = {
         F('of->number > known->second.first', 'of->number < known->second.first', 'the card opens at its oldest pictures'),
         F('m_stop || ++m_entries > mostEntries', 'false', 'a damaged card is counted without an end')],
     'src/platform/media/MediaFolders.cpp': [
-        F('m_told && media == m_last', 'false', 'the page draws its cards anew each second'),
+        F('m_told && media == m_last', 'false', 'the page draws its cards anew each second',
+          told='what is drawn is the same'),
         F('m_isMounted(folder)', 'true', 'a folder that is no card is offered')],
 
     'src/entry/album/AlbumCheck.cpp': [

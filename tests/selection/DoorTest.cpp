@@ -7,6 +7,7 @@
 #include "samples/SamplePhotographs.h"
 #include "samples/SamplePictureFiles.h"
 #include "selection/door/DoorNames.h"
+#include "selection/door/PictureDoor.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -85,8 +86,10 @@ TEST_F(TheDoor, ShowsEachPictureUprightUnderItsOwnNameAndOrdersWhatCanBePrinted)
     for (const std::size_t draft : {1, 4})
         EXPECT_GT(shown.Picture1[draft].bitmap.height(), shown.Picture1[draft].bitmap.width()) << draft;
     bool drafted = false;
-    QObject::connect(&page, &Page::changed,
-                     [&] { drafted = drafted || (shown.Picture1[3].waiting && !shown.Picture1[3].bitmap.isNull()); });
+    QObject::connect(&page, &Page::changed, [&] {
+        const bool made = machine.files.fileExists(DrivePath(shown.Picture1[3].text));
+        drafted = drafted || (!made && !shown.Picture1[3].bitmap.isNull());
+    });
     EXPECT_EQ(shown.Picture1[5].unreadable, u"a kind of file that can't be shown"_s) << "told by its header";
     waitForCells(page);
     const QStringList names{u"a.jpg"_s, u"b.jpg"_s, u"café.jpg"_s, u"d.heic"_s, u"e.jpg"_s, u"g.webp"_s};
@@ -151,18 +154,37 @@ TEST_F(TheDoor, HoldsTheOrderUntilItsPicturesAreMadeAndSaysWhichAreTakenOut) {
 }
 
 TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
-    machine.platform.doorProgram = "/no/such/program"; // as a disk that is full
+    machine.platform.doorProgram = host(u"C:\\door"_s); // not there, as room on a disk that is full
     kyoskNew& page = openWithTheFolder();
     page.Picture1_Click(3);
     for (const int told : {1, 2, 3}) {
+        if (told > 1)
+            page.Image7_Click();
         waitUntil([&] { return machine.dialogs.messages.size() == told && !page.controls().doorPanel.visible; });
-        page.Image7_Click();
     }
     EXPECT_EQ(machine.dialogs.messages.last(),
               u"The picture d.heic could not be made ready.\nWhat is ready stays. Please ask the staff.\n"
               u"A program is missing on this computer"_s);
     EXPECT_EQ(page.controls().List1.count(), 1);
     EXPECT_FALSE(page.controls().Frame4.visible);
+    std::filesystem::create_symlink(LUMORA_DOOR, machine.platform.doorProgram);
+    page.Image7_Click();
+    waitUntil([&page] { return page.controls().Frame4.visible; });
+}
+
+TEST_F(TheDoor, MakesRoomByWhatIsNotKept) {
+    PictureDoor door(machine.files, DoorDecoder(LUMORA_DOOR), state.door);
+    door.setFolder(DrivePath(doorFolders) / u"1");
+    const QStringList made{door.worked(u"C:\\p\\b.jpg"_s), door.worked(u"C:\\p\\café.jpg"_s),
+                           door.worked(u"C:\\p\\d.heic"_s)};
+    door.setKept([&](const QString& path) { return path == made[0]; }, 1);
+    for (const QString& path : made) {
+        door.want({path});
+        waitUntil([&] { return !door.isWaiting(path); });
+    }
+    EXPECT_EQ(door.stateOf(made[0]), PictureDoor::State::Ready);
+    EXPECT_TRUE(door.isWaiting(made[1]) && !machine.files.fileExists(DrivePath(made[1])));
+    EXPECT_EQ(door.stateOf(made[2]), PictureDoor::State::Ready) << "the latest";
 }
 
 qint64 bytesRead() {
@@ -270,7 +292,19 @@ TEST_F(TheDoor, NeverTakesOnePictureForAnother) {
     const QStringList second = page.controls().List2.items().sliced(1); // behind the last of the first time
     EXPECT_EQ(QSet<QString>(second.begin(), second.end()).size(), second.size());
     EXPECT_FALSE(second.contains(first[3])) << "the first card's";
-    EXPECT_TRUE(machine.files.fileExists(DrivePath(first[3])));
+    const QByteArray made = read(DrivePath(first[3]));
+
+    // Nor where the order comes back, and a third card.
+    page.Picture1_Click(0);
+    page.Image7_Click();
+    page.Command8_Click();
+    state.handOver.back = true;
+    chain.unload(PageId::kyoskNew);
+    kyoskNew& again = open();
+    put(u"d.heic"_s, heif(patches(64, 64), {}));
+    pick(again, u"C:\\p\\a.jpg"_s);
+    waitForCells(again);
+    EXPECT_EQ(read(DrivePath(first[3])), made);
 }
 
 } // namespace

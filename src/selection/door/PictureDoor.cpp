@@ -22,7 +22,6 @@ namespace {
 
 // The decoder is a process of its own and works on one processor.
 constexpr int madeAtOnce = 2;
-constexpr qint64 room = qint64(2) << 30;
 
 // Folders of one name on two cards get two folders here.
 QString keyOf(const HostPath& folder) {
@@ -297,7 +296,7 @@ void PictureDoor::makeRoom() {
     qint64 taken = 0;
     for (const QString& worked : m_made)
         taken += find(worked)->bytes;
-    for (qsizetype i = 0; i + 1 < m_made.size() && taken > room;) {
+    for (qsizetype i = 0; i + 1 < m_made.size() && taken > m_room;) {
         Picture& picture = *find(m_made[i]);
         if ((m_isKept && m_isKept(picture.worked)) || !m_files.removeFile(DrivePath(picture.worked))) {
             ++i;

@@ -68,8 +68,11 @@ public:
     // What is waiting among these is made in this order, and nothing else any more.
     void want(const QStringList& worked);
 
-    // The order's folder has room for 2 GiB: what was made first goes first, but for what this keeps.
-    void setKept(std::function<bool(const QString& worked)> isKept) { m_isKept = std::move(isKept); }
+    // The order's folder has room for so many bytes: what was made first goes first, but for what this keeps.
+    void setKept(std::function<bool(const QString& worked)> isKept, qint64 room = qint64(2) << 30) {
+        m_isKept = std::move(isKept);
+        m_room = room;
+    }
 
 Q_SIGNALS:
     // Ready, unreadable or not made.
@@ -125,6 +128,7 @@ private:
     QStringList m_draftsWanted;
     QStringList m_made; // the oldest first
     std::function<bool(const QString&)> m_isKept;
+    qint64 m_room = qint64(2) << 30;
     int m_running = 0;
     std::stop_source m_stop; // of what is being made
     std::shared_ptr<Desk> m_desk;

@@ -55,6 +55,10 @@ const std::map<std::string, void (*)()> deeds{
     {"aborts", std::abort},
     {"aborts its parent", [] { ::syscall(SYS_tgkill, parent, parent, SIGABRT); }},
     {"says that it read nothing", [] { _exit(static_cast<int>(DoorStatus::NotRead)); }},
+    {"says done of a PNG",
+     [] {
+         end({"\x89PNG\r\n\x1A\n\0\0\0\x0DIHDR\0\0\0\x08\0\0\0\x08\xFF\xD9", 26});
+     }},
     {"says done of rubbish", [] { end("rubbish\xFF\xD9"); }},
     {"says done of half",
      [] {
