@@ -453,8 +453,7 @@ FAULTS = {
         F('scalePictureToJpeg(source, target, printQuality)', 'scalePictureToJpeg(source, target, 70)', 'plain prints are coarser than agreed')],
     'src/assembly/PrintPacker.cpp': [
         F('m_files.fileExists(print) ? m_files.removeFile(print) : Result<void>()', 'Result<void>()', 'half of a print that the log names as failed is sent'),
-        F('static_cast<void>(picture());', '', 'a print that was made ahead comes out as its neighbour',
-          told='two removals in a row must fail on a disk that takes all writes'),
+        F('static_cast<void>(picture());', '', 'a print that was made ahead comes out as its neighbour'),
         F('m_tail.form(m_tailForm, base)', 'm_tail.form(m_tailForm, line.code)', 'the tail names another picture')],
     'src/assembly/plain/PlainPreparation.cpp': [
         F('ending == u"JPG" || ending == u"jpg"', 'ending == u"jpg"', 'pictures of most cameras are left out'),
