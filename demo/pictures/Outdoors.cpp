@@ -715,7 +715,6 @@ void drawKite(Sheet& sheet) {
     stroke(painter, curve(hand, {560, 560}, {632, 226}), QColor(246, 244, 236, 190), 1.3);
 
     // The child, running up the hill, seen from behind.
-    const QPointF foot(392, 1022);
     sheet.soft({180, 990, 280, 70}, 6, [](QPainter& p) {
         p.setBrush(QColor(30, 44, 16, 150));
         p.drawEllipse(QPointF(318, 1030), 112, 14);
