@@ -68,9 +68,10 @@ TEST(Keyboard, MakesAWholeOrderWithoutAMouse) {
         if (focusName() != u"pickerGrid"_s)
             return; // a busy machine has not opened it yet
         look.stop();
-        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Right);
+        walk.settle(0);
+        walk.key(Qt::Key_Right);
         picked = true;
-        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+        walk.key(Qt::Key_Return);
     });
     look.start(100);
     press(walk, u"firstFolder"_s);

@@ -79,6 +79,7 @@ TEST(QuestionBox, AnswersWhatWasPressed) {
     for (const auto& [pressed, yes] :
          {std::pair("messageYes", true), {"messageNo", false}, {"Return", true}, {"Esc", false}}) {
         QTimer::singleShot(50, &walk.program().window(), [&walk, name = QString::fromLatin1(pressed)] {
+            walk.settle(0);
             if (name.startsWith(u"message"_s))
                 QTest::mouseClick(&walk.control(name), Qt::LeftButton);
             else

@@ -8,6 +8,7 @@
 #include "support/Take.h"
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/Overlay.h"
+#include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 #include "views/window/ScreenDialogs.h"
@@ -184,6 +185,7 @@ Page* Walk::find(PageId id) {
 void Walk::settle(int milliseconds) {
     QTest::qWait(milliseconds);
     m_program->window().renderNow(); // a busy machine may not have come to it in that time
+    m_program->window().presses().rest();
 }
 
 void Walk::expectDone(const Result<void>& step) {

@@ -60,6 +60,7 @@ public:
     bool pressable(const QString& page, const QString& control);
     // Lets the program work until the page is in front, for some seconds at most.
     void waitFor(const QString& page);
+    // Works and looks for a while, as a person does before the next press.
     void settle(int milliseconds = 30);
     // Gives the window the keyboard, and hits a key of it.
     void activate();

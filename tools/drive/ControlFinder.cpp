@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "views/kit/ChoiceCards.h"
+#include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 
@@ -156,6 +157,7 @@ Result<QWidget*> ControlFinder::inSight(const QString& page, const QString& cont
     const Result<PageView*> found = view(page);
     if (!found)
         return found.failure();
+    m_window.presses().rest();
     const PageView::Control* bound = (*found)->control(control);
     QWidget* widget = bound ? bound->widget.data() : (*found)->findChild<QWidget*>(control);
     if (!widget)

@@ -23,6 +23,10 @@ void keepPlaceWhenHidden(QWidget& widget) {
     widget.setSizePolicy(policy);
 }
 
+void changesSight(QWidget& widget) {
+    widget.setProperty("changesSight", true);
+}
+
 void setRole(QWidget* widget, const char* role) {
     widget->setProperty("role", QString::fromLatin1(role));
 }

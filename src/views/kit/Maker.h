@@ -76,6 +76,9 @@ private:
 QLabel* centred(QLabel* label);
 // What lies beside the widget stays where it is when the widget hides.
 void keepPlaceWhenHidden(QWidget& widget);
+// Where the widget shows or hides, a person sees something else: a press that comes right behind it is not meant for
+// it.
+void changesSight(QWidget& widget);
 // Labels take their look from the theme by this.
 QLabel* makeLabel(QWidget* parent, const char* type);
 void setRole(QWidget* widget, const char* role);

@@ -19,6 +19,7 @@ Overlay::Overlay(const Theme& theme, QWidget* parent, std::initializer_list<Item
     , Maker(theme, this)
     , m_theme(theme) {
     hide();
+    changesSight(*this);
     const Card card = makeCard("card", Pad::Wide, Space::Wide);
     m_card = card.frame;
     m_column = card.column;

@@ -31,6 +31,8 @@ nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     m_steps->addWidget(makeTerms());
     m_album = std::make_unique<Album>(*this);
     m_steps->addWidget(m_album->widget());
+    for (int i = 0; i < m_steps->count(); ++i)
+        changesSight(*m_steps->widget(i));
     frame().content()->addWidget(content, 1);
     makeBars();
     m_focusRequest = page.focus().request;

@@ -39,6 +39,8 @@ nnnView::Album::Album(nnnView& view)
            cards(m_shown.Combo4Niyar, 3, {Glossy, Matte, Silk}, {290, 260}, &AlbumPanels::Combo4Niyar_Click));
     m_panels->addWidget(makeExtras());
     m_panels->addWidget(makeBill());
+    for (int i = 0; i < m_panels->count(); ++i)
+        changesSight(*m_panels->widget(i));
     addNext(m_shown.Command17, &AlbumPanels::Command17_Click);
     addNext(m_shown.Command16, &AlbumPanels::Command16_Click);
     addNext(m_shown.Command18, &AlbumPanels::Command18_Click);

@@ -5,6 +5,7 @@
 #include "views/kit/FocusRing.h"
 #include "views/kit/Overlay.h"
 #include "views/window/PageView.h"
+#include "views/window/PressFilter.h"
 
 #include <QApplication>
 #include <QCloseEvent>
@@ -20,7 +21,8 @@ using namespace Qt::StringLiterals;
 MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     : m_chain(chain)
     , m_state(state)
-    , m_theme(std::make_unique<Theme>(1.0)) {
+    , m_theme(std::make_unique<Theme>(1.0))
+    , m_presses(new PressFilter(this)) {
     setObjectName(u"lumoraWindow"_s);
     setAttribute(Qt::WA_StyledBackground);
     setWindowTitle(u"Lumora"_s);
@@ -40,6 +42,10 @@ MainWindow::~MainWindow() {
 
 void MainWindow::registerView(PageId id, ViewMaker maker) {
     m_makers[id] = std::move(maker);
+}
+
+DoubledPress& MainWindow::presses() {
+    return m_presses->rule;
 }
 
 PageView* MainWindow::viewOf(const Page& page) const {

@@ -15,8 +15,10 @@ class QStackedLayout;
 
 namespace lumora {
 
+class DoubledPress;
 class PageChain;
 class PageView;
+class PressFilter;
 struct SessionState;
 
 // The program's one window. It follows the page chain: the view of the page in front is shown, a view lives as long as
@@ -37,6 +39,7 @@ public:
     PageView* viewBelow() const { return m_below; }
     PageView* viewOf(const Page& page) const;
     const Theme& theme() const { return *m_theme; }
+    DoubledPress& presses();
 
     // Asked where the window is closed on a page without an exit of its own; unset: the program ends.
     std::function<bool()> mayEnd;
@@ -62,6 +65,7 @@ private:
     std::unique_ptr<Theme> m_theme;
     std::map<PageId, ViewMaker> m_makers;
     std::map<const Page*, PageView*> m_views;
+    PressFilter* m_presses;
     QStackedLayout* m_stack = nullptr;
     PageView* m_front = nullptr;
     PageView* m_below = nullptr;

@@ -74,6 +74,7 @@ PageView::PageView(Page& page, const SessionState& state, const Theme& theme)
     , m_theme(theme) {
     setObjectName(pageName(page.id()));
     setRole(this, "page");
+    changesSight(*this);
     setAttribute(Qt::WA_StyledBackground);
     setFocusPolicy(Qt::NoFocus);
     auto* column = new QVBoxLayout(this);

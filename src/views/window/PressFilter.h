@@ -1,0 +1,28 @@
+#pragma once
+
+#include "views/window/DoubledPress.h"
+
+#include <QObject>
+
+class QWidget;
+
+namespace lumora {
+
+// Keeps doubled presses of mouse, finger, Enter and blank from every control of the window.
+class PressFilter : public QObject {
+    Q_OBJECT
+public:
+    explicit PressFilter(QWidget* window);
+
+    DoubledPress rule;
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    QWidget* m_window;
+    bool m_mouseTaken = false; // a press that did not count, until it is let go
+    bool m_keyTaken = false;
+};
+
+} // namespace lumora
