@@ -232,4 +232,17 @@ Result<void> OrderJournal::wentByMail() {
     return keep(next);
 }
 
+Result<void> OrderJournal::tried(const BothLanguages& why) {
+    OrderState next = m_state;
+    ++next.tries;
+    next.why = why;
+    return keep(next);
+}
+
+Result<void> OrderJournal::givenUp() {
+    OrderState next = m_state;
+    next.givenUp = true;
+    return keep(next);
+}
+
 } // namespace lumora

@@ -63,6 +63,9 @@ public:
     // The order has arrived and the lab wants no report.
     Result<void> needsNoReport();
     Result<void> wentByMail();
+    // A sending by itself has ended without the order's arrival; the staff wants no more of them.
+    Result<void> tried(const BothLanguages& why);
+    Result<void> givenUp();
     // The order that this one was prepared again from is gone, or is one of its own.
     Result<void> replacesNone();
 

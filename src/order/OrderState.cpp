@@ -98,6 +98,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         return takeTruth(value, state.folderMadeByUs);
     if (key == u"FewerAgreed")
         return takeTruth(value, state.fewerAgreed);
+    if (key == u"GivenUp")
+        return takeTruth(value, state.givenUp);
     if (key == u"SentBefore")
         return takeTruth(value, state.sentBefore);
     if (key == u"ProvenByNameOnly")
@@ -112,6 +114,12 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.filesSent = value.toInt();
     else if (key == u"FilesInAll")
         state.filesInAll = value.toInt();
+    else if (key == u"Tries")
+        state.tries = value.toInt();
+    else if (key == u"WhyHebrew")
+        state.why.hebrew = value;
+    else if (key == u"WhyEnglish")
+        state.why.english = value;
     else if (key == u"Replaces")
         state.replaces = value;
     else if (key == u"InHand")
@@ -155,6 +163,13 @@ QByteArray OrderState::write() const {
         writer.text(u"FilesSent"_s, QString::number(filesSent));
         writer.text(u"FilesInAll"_s, QString::number(filesInAll));
     }
+    if (phase < Phase::Arrived && tries > 0) {
+        writer.text(u"Tries"_s, QString::number(tries));
+        writer.text(u"WhyHebrew"_s, why.hebrew);
+        writer.text(u"WhyEnglish"_s, why.english);
+    }
+    if (phase < Phase::Arrived && givenUp)
+        writer.truth("GivenUp", true);
     for (const QString& path : filesInHand)
         writer.text(u"InHand"_s, path);
     if (!replaces.isEmpty())

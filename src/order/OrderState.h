@@ -15,6 +15,14 @@ namespace lumora {
 class Files;
 class OrderFolder;
 
+// A text that is kept before it is known in which language it will be read.
+struct BothLanguages {
+    QString hebrew;
+    QString english;
+
+    bool operator==(const BothLanguages&) const = default;
+};
+
 // How far an order has come, kept in the hidden file .order of its folder, so that it can be continued after the
 // program has ended. The file is never sent. docs/formats.md has the table.
 struct OrderState {
@@ -47,9 +55,13 @@ struct OrderState {
     int filesInAll = 0;            // 0: not counted
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
     Report report = Report::NotYet;
-    QString replaces;  // folder name of the order that this one was prepared again from
-    QStringList items; // lines of the basket; kept until the sending begins
-    QStringList marks; // PictureMark of each line's picture; none in a state of an older version
+    // Of an order that is sent by itself: tries that ended without its arrival, and what the last one ended with.
+    int tries = 0;
+    BothLanguages why;
+    bool givenUp = false; // the staff wants it sent by itself no more
+    QString replaces;     // folder name of the order that this one was prepared again from
+    QStringList items;    // lines of the basket; kept until the sending begins
+    QStringList marks;    // PictureMark of each line's picture; none in a state of an older version
     // Of the prints and pieces, by leaf name, in bytes: as they were prepared. None in a state of an older version.
     QMap<QString, qint64> lengths;
     QList<ListOutputEntry> choices; // as OrderChoices has them; kept until the lab was told

@@ -57,6 +57,8 @@ const std::vector<PageWay>& pageFlow() {
         {MoogMeret, ResentByHttp, UploadForm, IsLeft},
         {MoogMeret, PlainTakenUp, Form2, IsLeft},
         {MoogMeret, EditedTakenUp, B3, IsLeft},
+        {MoogMeret, SendingTakenUpByFtp, FtpFrm, IsLeft},
+        {MoogMeret, SendingTakenUpByHttp, UploadForm, IsLeft},
         {MoogMeret, PiecesWanted, SpltForm, Waits},
         {MoogMeret, NewOrderWanted, hatchala, IsLeft},
         {SpltForm, PiecesDone, MoogMeret, IsLeft},

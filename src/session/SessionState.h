@@ -259,6 +259,8 @@ struct SessionState {
     AlbumTail albumTail = AlbumTail::Customer;
     bool offerPutOff = false; // the customer has put off the unfinished orders for this run
     bool OperatorArea = true; // a customer may open the hidden area of the sending page
+    bool Waiting = false;     // orders that did not arrive are sent by themselves while nobody is at the start page
+    int waitingOrders = 0;    // how many there are, as the start page counted them last
 
     ClientProfile profile;
     OrderDetails shemot;

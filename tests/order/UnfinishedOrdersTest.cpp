@@ -3,6 +3,7 @@
 #include "order/OrderChoices.h"
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
+#include "order/WaitingOrders.h"
 #include "session/Workspace.h"
 #include "support/ExampleOrder.h"
 #include "support/Take.h"
@@ -156,6 +157,47 @@ TEST_F(OrdersOfAKiosk, GoOnWhereSomethingIsLeftToDo) {
     give(u"2026_11_21_KUP_1234^99"_s, inPhase(Phase::Preparing, u"99"_s));
     give(u"2026_11_21_KUP_1234^100"_s, inPhase(Phase::Preparing, u"100"_s));
     EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^100", "2026_11_21_KUP_1234^99", "2026_11_20_KUP_1234^9"}));
+}
+
+TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
+    OrderState givenUp = inPhase(Phase::Sending);
+    givenUp.givenUp = true;
+    give(u"2026_11_21_KUP_1234^104"_s, inPhase(Phase::Preparing), {print});
+    give(u"2026_11_21_KUP_1234^103"_s, givenUp, {print});
+    give(u"2026_11_21_KUP_1234^102"_s, inPhase(Phase::Sending), {print});
+    const OrderFolder lacking = give(u"2026_11_21_KUP_1234^101"_s, inPhase(Phase::Prepared), {print});
+    ASSERT_TRUE(test.files.writeWhole(
+        lacking.logPath(),
+        OrderLog::of(session, OrderLog::Layout::Plain, {}, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
+    const auto waiting = [this](bool on, bool careful) {
+        session.Waiting = on;
+        session.Careful = careful;
+        QString numbers;
+        for (const UnfinishedOrder& order : OrdersThatWait(session, test.platform))
+            numbers += order.folder.name().last(3) + u' ';
+        return numbers.toStdString();
+    };
+    EXPECT_EQ(waiting(false, false), "");
+    EXPECT_EQ(waiting(true, false), "101 102 ");
+    EXPECT_EQ(waiting(true, true), "102 ") << "the customer is to answer about the pictures left out";
+
+    using std::chrono::minutes;
+    std::optional<WaitingOrders> rule(std::in_place, session, test.platform);
+    rule->refresh();
+    const auto pauses = [&](minutes pause) {
+        test.clock.ran += pause - std::chrono::milliseconds(1);
+        const bool early = rule->due().has_value();
+        test.clock.ran += std::chrono::milliseconds(1);
+        rule->refresh(); // another visit to the start page changes nothing
+        return !early && rule->due();
+    };
+    for (const int pause : {1, 2, 5, 15, 60, 60}) {
+        ASSERT_TRUE(pauses(minutes(pause))) << pause;
+        rule->ended(rule->due()->folder, {});
+    }
+    rule.emplace(session, test.platform); // the program was killed
+    rule->refresh();
+    EXPECT_TRUE(pauses(minutes(60)));
 }
 
 TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {

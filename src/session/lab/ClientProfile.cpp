@@ -50,6 +50,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.Careful = deployment.Careful;
     state.door = deployment.door;
     state.OperatorArea = deployment.OperatorArea;
+    state.Waiting = deployment.Waiting;
     state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;

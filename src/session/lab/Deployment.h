@@ -34,6 +34,7 @@ struct Deployment {
     bool watchedCards = false; // cards and sticks show themselves; else they are found by looking
     bool OperatorArea = true;
     bool OperatorEditor = false;
+    bool Waiting = false; // orders that did not arrive are sent by themselves while nobody is at the start page
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;
 

@@ -248,6 +248,8 @@ std::vector<Row> rows() {
         {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
         {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},
 
+        {"Kiosk", "Waiting", yesNo(at(&D::Waiting), true, false)},
+
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",
          text(at(&D::dataFolder), u"the whole path of a folder, beginning with /, or empty"_s, u"(?s)(/.*)?"_s)},
