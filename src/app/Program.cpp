@@ -20,6 +20,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/lab/LabFile.h"
+#include "transfer/waiting/WaitingSending.h"
 #include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
 
@@ -67,7 +68,8 @@ struct Program::Parts {
         , window(chain, state)
         , dialogs(window, state, files, cards, clock)
         , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
-                   cards, doorProgram()} {
+                   cards, doorProgram()}
+        , waiting(state, platform, chain, deployment) {
         // A medium has its letter before any page hears of it.
         QObject::connect(&cards, &Cards::changed, &window, [this] { drives.refreshMedia(); });
         dialogs.beforePick = [this] { drives.refreshMedia(); };
@@ -96,6 +98,7 @@ struct Program::Parts {
     MainWindow window;
     ScreenDialogs dialogs;
     Platform platform;
+    WaitingSending waiting;
     std::optional<ForwardCalls> forwardCalls;
 };
 

@@ -6,6 +6,7 @@
 #include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "order/OrderNames.h"
+#include "order/WaitingOrders.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -106,11 +107,24 @@ QString SendingPage::adviceOf(const PhaseLook& row) const {
         return wording(answerAwaitedAdvice);
     if (row.phase == SendingPhase::Success && m_state.Careful && report().isEndUnknown())
         return wording(untoldAdvice);
+    if (goesOnByItself(row.phase)) {
+        const QString phone = m_state.profile.LabPhone.trimmed();
+        return wording(goesOnByItselfAdvice) + (phone.isEmpty() ? phone : wording(labPhoneAdvice).arg(phone));
+    }
     const bool lacksChosen = !m_state.transfer.leftOut.isEmpty();
     if (lacksChosen && row.phase == SendingPhase::Reporting)
         return wording(partReportingAdvice);
     const bool countIsTold = m_lacking && row.phase == SendingPhase::AllThere;
     return lacksChosen && row.tellsWhole && !countIsTold ? wording(partSentAdvice) : advice(row);
+}
+
+bool SendingPage::goesOnByItself(SendingPhase phase) const {
+    if (phase != SendingPhase::NotAll && phase != SendingPhase::Unclear && phase != SendingPhase::Stopped)
+        return false;
+    const QList<UnfinishedOrder> waiting = OrdersThatWait(m_state, m_platform);
+    return std::any_of(waiting.begin(), waiting.end(), [this](const UnfinishedOrder& order) {
+        return order.folder.path() == m_state.transfer.OrderFolder;
+    });
 }
 
 void SendingPage::goOnWithout() {
@@ -177,11 +191,31 @@ SendingGauge SendingPage::gauge() const {
 }
 
 void SendingPage::tellReason(LineStep step, const Failure& failure, const QString& subject) {
+    m_trouble = {step, failure, subject};
     m_reason = LineTroubleText(m_state, step, failure, subject);
     m_shown.Label4Reason.text = m_reason;
     m_shown.Label4Reason.hint = failure.message;
     m_shown.Label4Reason.visible = true;
     Q_EMIT changed();
+}
+
+bool SendingPage::hasEnded() const {
+    return !isUnderWay(m_phase) && m_phase != SendingPhase::Preparing && m_phase != SendingPhase::Countdown;
+}
+
+BothLanguages SendingPage::whyItEnded() const {
+    if (!m_trouble)
+        return {QString::fromUtf16(look().title.hebrew), QString::fromUtf16(look().title.english)};
+    SessionState reader = m_state;
+    const auto in = [&](std::int16_t language) {
+        reader.EnglishTips = language;
+        return LineTroubleText(reader, m_trouble->step, m_trouble->failure, m_trouble->subject);
+    };
+    return {in(0), in(1)};
+}
+
+bool SendingPage::isAtRest() const {
+    return look().buttons.testFlag(SendingButton::NewOrder) && !lineInUse();
 }
 
 void SendingPage::forgetReason() {

@@ -2,6 +2,7 @@
 
 #include "imaging/Bitmap.h"
 #include "order/OrderCompleteness.h"
+#include "order/OrderState.h"
 #include "session/Page.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/Countdown.h"
@@ -44,6 +45,15 @@ public:
     SendingGauge gauge() const;
     const Countdown& countdown() const { return m_countdown; }
     const SendingControls& sendingControls() const { return m_shown; }
+
+    // The page has come to an end, or waits for an answer.
+    bool hasEnded() const;
+    // The reason that was told last; where none was, the title of the phase.
+    BothLanguages whyItEnded() const;
+    // Nothing is left to do but to begin a new order, or to send again. Then the page may be left where nobody is
+    // there.
+    bool isAtRest() const;
+    void leaveUnattended() { leaveForNewOrder(); }
 
     // As SmallLeftOut().
     Bitmap smallLeftOut(int index, int cell) const;
@@ -111,6 +121,7 @@ protected:
 
 private:
     QString adviceOf(const PhaseLook& row) const;
+    bool goesOnByItself(SendingPhase phase) const;
     void goOnWithout();
     void goBack();
     // What the log of an order that is sent again names as failed.
@@ -128,6 +139,13 @@ private:
     SendingPhase m_phase = SendingPhase::Preparing;
     bool m_activated = false;
     QString m_reason; // what the last failure means
+    // The failure that was told last.
+    struct Trouble {
+        LineStep step;
+        Failure failure;
+        QString subject;
+    };
+    std::optional<Trouble> m_trouble;
 };
 
 } // namespace lumora

@@ -39,6 +39,12 @@ inline constexpr SendingWords untoldAdvice{
 inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
                                             u"The order is kept on this computer. Please call the lab."};
 
+inline constexpr SendingWords goesOnByItselfAdvice{
+    u"ההזמנה שמורה במחשב זה, ואנחנו ממשיכים לשלוח אותה. אין צורך להמתין.",
+    u"Your order is kept on this computer. We go on sending it; you need not wait."};
+// %1: the lab's telephone.
+inline constexpr SendingWords labPhoneAdvice{u" טלפון המעבדה: %1", u" The lab's telephone: %1"};
+
 // %1: the number.
 inline constexpr SendingWords numberTakenWords{
     u"המספר %1 כבר שייך בשרת להזמנה אחרת. ההזמנה תוכן מחדש במספר אחר.",
