@@ -44,12 +44,13 @@ struct hatchalaControls : Controls {
     Caption Image2{*this, u"Image2"};                          // the same
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
     ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
-    Caption Pic4Hemshech{*this, u"Pic4Hemshech", Caption::At::Hidden}; // the panel that offers an unfinished order
-    Caption Label4Hemshech{*this, u"Label4Hemshech"};                  // its number, and how far it came
-    Caption Label4Od{*this, u"Label4Od", Caption::At::Hidden};         // how many more there are
-    Caption Command4Hemshech{*this, u"Command4Hemshech"};              // goes on with it
-    Caption Command4Achar{*this, u"Command4Achar"};                    // puts it off
-    Caption Command4Bitul{*this, u"Command4Bitul"};                    // throws it away
+    Caption Pic4Hemshech{*this, u"Pic4Hemshech", Caption::At::Hidden};     // the panel that offers an unfinished order
+    Caption Label4Hemshech{*this, u"Label4Hemshech"};                      // its number, and how far it came
+    Caption Label4Od{*this, u"Label4Od", Caption::At::Hidden};             // how many more there are
+    Caption Command4Hemshech{*this, u"Command4Hemshech"};                  // goes on with it
+    Caption Command4Achar{*this, u"Command4Achar"};                        // puts it off
+    Caption Command4Bitul{*this, u"Command4Bitul"};                        // throws it away
+    Caption Label4Mamtinot{*this, u"Label4Mamtinot", Caption::At::Hidden}; // for the staff: how many orders wait
     DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
     // Never shown: two buttons that code presses, and the service panel with the settings as one line of text.
@@ -162,7 +163,9 @@ private:
 
     // hatchalaOffer.cpp
     void offerUnfinished();
+    void readUnfinished();
     void showOffer();
+    void showWaiting();
     void goOnWithOrder();
     void putOffOrder();
     void throwOrderAway();

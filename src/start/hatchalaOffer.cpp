@@ -1,10 +1,12 @@
 // The panel of the start page that offers an order which was not finished.
+#include "order/WaitingOrders.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "start/hatchala.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace lumora {
@@ -17,7 +19,21 @@ void hatchala::offerUnfinished() {
         return;
     TidyOrders(m_state, m_platform.files);
     if (!m_state.offerPutOff)
-        m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+        readUnfinished();
+    m_state.waitingOrders = static_cast<int>(OrdersThatWait(m_state, m_platform).size());
+}
+
+// What is sent by itself is no business of the next customer.
+void hatchala::readUnfinished() {
+    m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+    if (!m_state.Waiting)
+        return;
+    const QList<UnfinishedOrder> waiting = OrdersThatWait(m_state, m_platform);
+    m_unfinished.removeIf([&](const UnfinishedOrder& order) {
+        return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const UnfinishedOrder& other) {
+                   return other.folder.path() == order.folder.path();
+               });
+    });
 }
 
 void hatchala::goOnWithOrder() {
@@ -57,7 +73,7 @@ void hatchala::throwOrderAway() {
     if (const Result<void> gone = ThrowAwayOrder(m_platform.files, order.folder); !gone)
         m_platform.dialogs.message(gone.failure().message);
     m_asksForGone = false;
-    m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+    readUnfinished();
     showOffer();
 }
 

@@ -48,6 +48,7 @@ void hatchala::setTexts() {
     Label3.visible = Label4.visible = m_state.english();
     setHelp();
     showOffer();
+    showWaiting();
 
     const int chosen = List1.currentIndex();
     List1.clear();
@@ -107,6 +108,14 @@ QString hatchala::offerText(const UnfinishedOrder& order) const {
         .arg(number)
         .arg(order.state.filesSent)
         .arg(order.state.filesInAll);
+}
+
+void hatchala::showWaiting() {
+    const int count = m_state.waitingOrders;
+    Label4Mamtinot.visible = count > 0;
+    Label4Mamtinot.text = count == 1
+                              ? m_state.wording(u"הזמנה אחת ממתינה לשליחה", u"1 order waits to be sent")
+                              : m_state.wording(u"%1 הזמנות ממתינות לשליחה", u"%1 orders wait to be sent").arg(count);
 }
 
 bool hatchala::asksToThrowAway(const QString& number) {

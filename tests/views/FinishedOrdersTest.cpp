@@ -3,6 +3,7 @@
 #include "finished/orders/MoogMeret.h"
 #include "finished/pieces/SpltForm.h"
 #include "imaging/files/PictureFile.h"
+#include "order/OrderState.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
@@ -24,6 +25,14 @@ QString makeOrders(Walk& walk) {
         walk.write(folder / u"!106_1234.jpp", *encodeJpeg(Bitmap(640, 480, Qt::cyan), 90));
         for (int i = 0; i < 9; ++i)
             walk.write(folder / u"0%1 1015GNB000%2_0%3AABB.jpp"_s.arg(i % 3 + 1).arg(i).arg(i), "print");
+        if (number == 103 || number == 105) {
+            OrderState state;
+            state.phase = OrderState::Phase::Sending;
+            state.number = QString::number(number);
+            state.tries = 108 - number;
+            state.why = {u"אין תשובה מהשרת."_s, u"The server gives no answer."_s};
+            walk.write(OrderFolder(folder).statePath(), state.write());
+        }
         for (int i = 1; i <= 3 && number == 106; ++i)
             walk.write(folder / u"02a_jpp_00%1_003.prk"_s.arg(i), "piece");
     }
@@ -36,8 +45,9 @@ class FinishedOrdersLook : public PageLook {};
 
 TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     // Nobody listens at this port.
-    Walk walk(GetParam(), u"[Switches]\nSplitPage = yes\n[Mail]\nServer = 127.0.0.1\nPort = 9\nTls = none\n"
-                          "From = kiosk@example.com\nTo = lab@example.com\n"_s);
+    Walk walk(GetParam(),
+              u"[Kiosk]\nWaiting = yes\n[Switches]\nSplitPage = yes\n[Mail]\nServer = 127.0.0.1\nPort = 9\nTls = none\n"
+              "From = kiosk@example.com\nTo = lab@example.com\n"_s);
     go(walk, toMenu + u"Image1(4)>MoogMeret :60-no-orders"_s);
     const QString pieces = makeOrders(walk);
     go(walk, u"Command5 :61-orders"_s);

@@ -83,7 +83,7 @@ protected:
 } // namespace
 
 TEST_P(SendingLook, HasNoFaultByFtpFromTheCountThroughAFailureToTheEnd) {
-    auto& page = open<FtpFrm>();
+    auto& page = open<FtpFrm>([](SessionState& state) { state.Waiting = true; });
     until(page, SendingPhase::Countdown);
     go(walk, u":17-countdown Command23"_s);
     EXPECT_EQ(page.phase(), SendingPhase::Waiting);
@@ -175,7 +175,7 @@ TEST_P(SendingLook, HasNoFaultWithoutAnOrderAndWithoutAServer) {
 
 TEST_P(SendingLook, HasNoFaultByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     lab.deadCalls = lab.deadPosts = FakeLab::always;
-    auto& page = open<UploadForm>();
+    auto& page = open<UploadForm>([](SessionState& state) { state.Waiting = true; });
     lookWhen(u"60-http-checking"_s, [&] { return page.controls().Pic4Hamten.visible; });
     until(page, SendingPhase::Countdown);
     go(walk, u":61-http-countdown Command3"_s);

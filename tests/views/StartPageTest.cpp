@@ -91,13 +91,17 @@ TEST_P(StartLook, HasNoFaultInAnyOfItsStates) {
 }
 
 TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
-    Walk walk(GetParam());
+    Walk walk(GetParam(), u"[Kiosk]\nWaiting = yes\n"_s);
     SessionState& state = walk.program().state();
-    for (const QString& number : {u"105"_s, u"106"_s}) {
+    for (const QString& number : {u"103"_s, u"104"_s, u"105"_s, u"106"_s}) {
         const OrderFolder folder(WorkspacePaths::orders(state) / (u"2026_11_21_KUP_1234^"_s + number));
         std::filesystem::create_directories(*walk.program().platform().files.drives().toHost(folder.path()));
         OrderState order;
         order.number = number;
+        if (number < u"105"_s) { // sent by itself, and not offered
+            order.phase = OrderState::Phase::Sending;
+            walk.write(folder.filePath(u"021015GNB0000_03AABB.jpp"_s), "print");
+        }
         order.kind = OrderKind::Print;
         order.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\two.jpg"_s};
         ASSERT_TRUE(WriteOrderState(walk.program().platform().files, folder, order));
@@ -112,6 +116,8 @@ TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
     walk.press(u"hatchala"_s, u"Command4Achar"_s);
     walk.press(u"hatchala"_s, u"Command4Achar"_s);
     EXPECT_FALSE(startPage(walk).controls().Pic4Hemshech.visible);
+    EXPECT_TRUE(walk.control(u"Label4Mamtinot"_s).isVisible());
+    look(walk, u"01-start-waiting"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, StartLook, PageLook::screens(), PageLook::nameOf);

@@ -6,6 +6,7 @@
 #include "order/HistoryState.h"
 #include "order/OrderDetailsReader.h"
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "order/OrderNames.h"
 #include "order/OrderSender.h"
 #include "platform/Dialogs.h"
@@ -131,15 +132,19 @@ void MoogMeret::refreshOrders() {
     List2.clear();
     List3.clear();
     m_notFinished.clear();
+    m_givenUp.clear();
     for (const QString& name : Dir1.items()) {
         List2.append((orders / name).text());
         List3.append(name);
         if (CompletionOf(m_platform.files, OrderFolder(orders / name)) != Completion::Finished)
             m_notFinished += name;
+        if (m_state.Waiting && OrderJournal(m_platform.files, OrderFolder(orders / name)).state().givenUp)
+            m_givenUp += name;
     }
     Picture1 = {};
     Label4Rek.visible = List3.isEmpty();
     Label4Bhar.visible = !List3.isEmpty();
+    listWaiting();
     enter(Phase::Orders);
 }
 

@@ -3,6 +3,7 @@
 #include "finished/mail/PackageWalk.h"
 #include "finished/orders/FilesToSend.h"
 #include "imaging/Bitmap.h"
+#include "order/UnfinishedOrders.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"
@@ -14,7 +15,6 @@ class OrderFolder;
 class PageChain;
 struct OrderDetails;
 struct Platform;
-struct UnfinishedOrder;
 
 struct MoogMeretControls : Controls {
     Caption Title{*this, u"Title"};
@@ -52,6 +52,12 @@ struct MoogMeretControls : Controls {
     Caption Label10{*this, u"Label10"};
     Caption Label7{*this, u"Label7"};
     Caption Label4Lakoach{*this, u"Label4Lakoach"}; // the customer named in the order's log
+
+    Caption waitingPanel; // orders that are sent by themselves, beside the hint
+    Caption Label4Mamtinot{*this, u"Label4Mamtinot"};
+    TextList List4Mamtinot{*this, u"List4Mamtinot"}; // oldest first
+    Caption Command4Nase{*this, u"Command4Nase"};    // sends the chosen one now
+    Caption Command4Vater{*this, u"Command4Vater"};  // gives it up
 
     Caption Label4Shalav3{*this, u"Label4Shalav3", Caption::At::Hidden}; // step three
     // The preview of the order's first file: a window of this size on Picture1, which moves scrollStep pixels up and
@@ -118,6 +124,9 @@ public:
     void Command4Orders_Click() { refreshOrders(); }
     void Command4Pieces_Click() { showPieces(); }
     void Command28_Click() { beginNewOrder(); }
+    void List4Mamtinot_Click(int index) { chooseWaiting(index); }
+    void Command4Nase_Click() { tryNow(); }
+    void Command4Vater_Click() { giveUp(); }
     void Command18_Click() { leaveAfterWalk(); }
     void Command6_Click() { leaveProgram(); }
 
@@ -174,6 +183,14 @@ private:
     void offerToThrowAway(const OrderFolder& folder);
     void finishOrder(const OrderFolder& folder);
 
+    // MoogMeretWaiting.cpp
+    void listWaiting();
+    void chooseWaiting(int index);
+    void tryNow();
+    void giveUp();
+    const UnfinishedOrder* chosenWaiting() const;
+    QString megabytesOf(const OrderFolder& folder) const;
+
     void showOrder(const DrivePath& folder);
     void showWhatIsMarked();
     void loadPreview();
@@ -197,6 +214,8 @@ private:
     bool asksToSendWithoutDetails();
     bool asksToGoOnWithoutGone(const UnfinishedOrder& order);
     bool asksToThrowAway(const QString& number);
+    bool asksToGiveUp(const QString& number);
+    QString waitingRow(const UnfinishedOrder& order) const;
     bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
 
     void sendByMail();
@@ -223,6 +242,8 @@ private:
     PageChain& m_chain;
     FilesToSend m_files;
     QStringList m_notFinished; // names of the listed orders whose preparation did not come to its end
+    QStringList m_givenUp;     // and of those that the staff has given up
+    QList<UnfinishedOrder> m_waiting;
     PackageWalk m_walk;
     bool m_walksWholeOrder = false; // all prints of the order are among the packages
     Ticker Timer3;

@@ -37,6 +37,9 @@ void MoogMeret::setTexts() {
             {Command28, u"הזמנה חדשה", u"New order"},
             {Command4Orders, u"חזרה לרשימת ההזמנות", u"Back to the orders"},
             {Command4Pieces, u"חיתוך ואיחוד קבצים", u"Cut and join files"},
+            {Label4Mamtinot, u"ממתינות לשליחה", u"Waiting to be sent"},
+            {Command4Nase, u"נסה עכשיו", u"Try now"},
+            {Command4Vater, u"ותר", u"Give up"},
             {Command13, u"שלח לפ י שיטה 1", u"Send by method 1"},
             {Command18, u"Exit  יציאה", u"Exit"},
             {Command19, u"עצור משלוח", u"Stop sending"},
@@ -61,7 +64,25 @@ MoogMeret::OrderRow MoogMeret::orderRow(const QString& folderName) const {
         row.hint = m_state.wording(u"הזמנה בחלקים"_s, u"An order in pieces"_s);
     if (m_notFinished.contains(folderName))
         row.mark = m_state.wording(u"לא הושלמה"_s, u"not finished"_s);
+    if (m_givenUp.contains(folderName))
+        row.mark = m_state.wording(u"ויתרו על שליחתה"_s, u"given up"_s);
     return row;
+}
+
+QString MoogMeret::waitingRow(const UnfinishedOrder& order) const {
+    const OrderDetails details = detailsOf(order.folder.path());
+    const QString tries = m_state.wording(u"ניסיונות: %1, גודל: %2 מ\"ב"_s, u"tries: %1, size: %2 MB"_s)
+                              .arg(QString::number(order.state.tries), megabytesOf(order.folder));
+    QStringList lines{orderRow(order.folder.name()).text, QString(details.n1 + u' ' + details.n2).trimmed(), tries,
+                      m_state.wording(order.state.why.hebrew, order.state.why.english)};
+    lines.removeAll(QString());
+    return lines.join(u'\n');
+}
+
+bool MoogMeret::asksToGiveUp(const QString& number) {
+    return asks(u"הזמנה מספר %1 לא תישלח עוד מעצמה. התיקייה שלה נשארת במחשב זה. לוותר עליה?",
+                u"Order number %1 will not be sent by itself any more. Its folder stays on this computer. Give it up?",
+                {number});
 }
 
 bool MoogMeret::asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers) {

@@ -42,9 +42,25 @@ QWidget* MoogMeretView::makeHint() {
                                        {sign(u"pictures"_s, IconSize::Page, Theme::Colour::Edge), 0, Qt::AlignCenter},
                                        centred(label(c.Label4Rek, "large")),
                                        centred(label(c.Label4Bhar, "large")),
-                                       Item::room()}));
+                                       Item::room(),
+                                       {makeWaiting(), 4}}));
     follow(hint, c.hintPanel);
     return hint;
+}
+
+// What is sent by itself, for the staff.
+QWidget* MoogMeretView::makeWaiting() {
+    m_waiting = list(c.List4Mamtinot, &MoogMeret::List4Mamtinot_Click);
+    m_waiting->setWordWrap(true);
+    const Card card = makeCard("card", Pad::Normal);
+    add(*card.column,
+        {label(c.Label4Mamtinot, "strong"),
+         {m_waiting, 1},
+         inRow(Space::Normal,
+               {button(c.Command4Vater, Role::Quiet, &MoogMeret::Command4Vater_Click, u"trash"_s), Item::room(),
+                button(c.Command4Nase, Role::Secondary, &MoogMeret::Command4Nase_Click, u"send"_s)})});
+    follow(card.frame, c.waitingPanel);
+    return card.frame;
 }
 
 QWidget* MoogMeretView::makeFiles() {
@@ -144,6 +160,7 @@ void MoogMeretView::renderOrders() {
     if (c.List3.currentIndex() < 0 && m_orders->count() > 0)
         m_orders->scrollToBottom(); // the latest order
     m_orders->setAccessibleName(c.Label4Shalav1.text);
+    m_waiting->setAccessibleName(c.Label4Mamtinot.text);
     for (int row = 0; row < m_orders->count(); ++row) {
         QListWidgetItem* item = m_orders->item(row);
         const MoogMeret::OrderRow order = m_page.orderRow(c.List3.item(row));

@@ -21,6 +21,7 @@ protected:
 private:
     QWidget* makeOrders();
     QWidget* makeHint();
+    QWidget* makeWaiting();
     QWidget* makeFiles();
     QWidget* makeWalk();
     QWidget* makeWays();
@@ -31,6 +32,7 @@ private:
     void renderAnswer();
 
     QListWidget* m_orders = nullptr;
+    QListWidget* m_waiting = nullptr;
     QListWidget* m_fileList = nullptr;
     QLabel* m_counts = nullptr;
     ScrolledPicture* m_preview = nullptr;

@@ -139,7 +139,7 @@ void hatchalaView::makeStart() {
     bind(m_start, c.Image1);
     frame().addMainAction(m_start);
     frame().addSecondaryAction(button(c.Image8, Role::Quiet, &hatchala::Image8_Click, u"globe"_s));
-    frame().addStatus({label(c.Label7, "muted"), label(c.Label6, "large")});
+    frame().addStatus({label(c.Label4Mamtinot, "smallMuted"), label(c.Label7, "muted"), label(c.Label6, "large")});
     helpFor(m_start, hatchala::Hover::Image1);
 }
 
