@@ -4,7 +4,7 @@ FTP: command -> (what is done, how often, from which coming on), see relay.py. H
 import re
 import time
 
-from relay import ALWAYS, drop
+from relay import ALWAYS, Act, drop
 
 STRAY = 'Thumbs.db'
 
@@ -192,6 +192,26 @@ def state_not_kept(prepared):
     return plays
 
 
+def three_wait(case):
+    """Three orders whose server is down; it comes back, and the program that sends them by itself is killed in a file of the second."""
+    case.switches = '[Kiosk]\nWaiting = yes\n[Switches]\n'
+    told = [case.play(case.order_of, case.way) and 'you need not wait' in case.mine.said for _ in range(3)]
+    case.acts['STOR'] = Act(lambda session, line: session.forward(
+        line, change=lambda content: case.mine.kill() or content[:len(content) // 2]), 1, IN_THE_SECOND)
+    case.play('waiting', healed=True)
+    killed = case.mine.status == -9
+    case.heal()
+    case.play('waiting', healed=True)
+    here = [(order.name, name, content) for order in case.mine.orders() for name, content in case.mine.files(order).items() if name != '000.jpg']
+    there = all((case.arrived / order / name).is_file() and (case.arrived / order / name).read_bytes() == content for order, name, content in here)
+    case.result = 'arrived whole' if len(here) == 15 and there else 'LIE: files missing or damaged'
+    twice = sum(already for _, already in case.relay.puts)
+    case.found = [text for text, is_so in (('the customer is not told', not all(told)), ('not killed', not killed), ('still waiting', case.mine.status != 0),
+                                           (f'{twice} sent twice', twice > 0)) if is_so] + case.wrong_reports(3)
+
+
+IN_THE_SECOND = 9    # of the puts; an order has six
+
 # The third put is a print. Of a pair the first number is that with a session for each file, the second that with a session kept.
 PRINT = 3
 MIDDLE = (12, 6)    # a listing of the order's folder with files in it
@@ -201,6 +221,7 @@ FTP = [
     Fault('as installed, under TYPE A', only=('pure-ftpd', 'proftpd'), as_installed=True, heals=False),
     # the way to the server
     Fault('nobody listens', host='closed', only=('scripted',)),
+    Fault('nobody listens to three orders, then killed', host='closed', only=('scripted',), plays=three_wait, quick=True),
     Fault('a black hole', host='blackhole', only=('scripted',), clock=60),
     Fault('IPv6 only', host='ipv6'),
     Fault('connects and stays silent', {'CONNECT': hang}, clock=120, only=('scripted',)),
