@@ -25,7 +25,8 @@ QString makeOrders(Walk& walk) {
         walk.write(folder / u"!106_1234.jpp", *encodeJpeg(Bitmap(640, 480, Qt::cyan), 90));
         for (int i = 0; i < 9; ++i)
             walk.write(folder / u"0%1 1015GNB000%2_0%3AABB.jpp"_s.arg(i % 3 + 1).arg(i).arg(i), "print");
-        if (number == 103 || number == 105) {
+        if (number == 101 || number == 103) {
+            walk.write(folder / u"021015GNB0000_03AABB.jpp", "a print as the program names it");
             OrderState state;
             state.phase = OrderState::Phase::Sending;
             state.number = QString::number(number);
