@@ -1,6 +1,6 @@
 #include "views/Form3/Form3View.h"
 
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 namespace lumora {
 

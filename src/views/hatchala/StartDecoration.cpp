@@ -1,7 +1,7 @@
 #include "views/hatchala/StartDecoration.h"
 
 #include "start/StartMotion.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 #include <QPainter>
 #include <QPainterPath>

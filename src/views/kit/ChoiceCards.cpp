@@ -1,6 +1,6 @@
 #include "views/kit/ChoiceCards.h"
 
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/Theme.h"
 
 #include <QGridLayout>

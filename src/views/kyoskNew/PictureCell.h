@@ -1,7 +1,7 @@
 #pragma once
 
 #include "editing/ResolutionCaption.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 class QLabel;
 class QPushButton;

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 namespace lumora {
 

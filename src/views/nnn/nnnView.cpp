@@ -2,7 +2,7 @@
 
 #include "common/PaperSize.h"
 #include "entry/details/TileMenu.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
 #include "views/nnn/nnnViewAlbum.h"
 

@@ -1,6 +1,6 @@
 #include "views/preparation/B3View.h"
 
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 #include <QListWidget>
 

@@ -1,6 +1,6 @@
 #include "views/preparation/PreparationView.h"
 
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/Gauge.h"
 
 namespace lumora {

@@ -1,7 +1,7 @@
 #include "views/sending/FtpFrmView.h"
 
 #include "common/DrivePath.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
 
 #include <QProgressBar>

@@ -1,7 +1,7 @@
 // The editor's panels: tones, turns, the hints in words, and the operator's tools.
 #include "editing/render/EditedPicture.h"
 #include "editing/render/LineFrame.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
 #include "views/kit/ToolButton.h"
 #include "views/tFrmNew/EditorPaper.h"

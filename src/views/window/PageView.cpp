@@ -2,7 +2,7 @@
 
 #include "imaging/files/PictureFile.h"
 #include "platform/files/Files.h"
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/Keyboard.h"
 

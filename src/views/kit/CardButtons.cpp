@@ -1,4 +1,4 @@
-#include "views/kit/Cards.h"
+#include "views/kit/CardButtons.h"
 
 #include <QPainterPath>
 
