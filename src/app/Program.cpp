@@ -70,8 +70,10 @@ struct Program::Parts {
         , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
                    cards, doorProgram()}
         , waiting(state, platform, chain, deployment) {
-        // A medium has its letter before any page hears of it.
-        QObject::connect(&cards, &Cards::changed, &window, [this] { drives.refreshMedia(); });
+        // A medium has its letter before any page hears what it holds.
+        cards.setLook([this, roots = drives.mediaRoots()]() -> std::function<void()> {
+            return [this, found = Drives::findMedia(roots)] { drives.giveLetters(found); };
+        });
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
             const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);

@@ -1,4 +1,5 @@
 #include "platform/media/CardSummary.h"
+#include "platform/media/Cards.h"
 #include "platform/media/MediaFolders.h"
 #include "platform/media/SystemMedia.h"
 #include "platform/media/UdisksMedia.h"
@@ -16,6 +17,7 @@
 
 #include <chrono>
 #include <fstream>
+#include <semaphore>
 
 namespace lumora {
 namespace {
@@ -177,6 +179,29 @@ TEST(MediaFolders, StandInWhereNoServiceAnswersAndTellWhatComesAndGoes) {
     EXPECT_EQ(now.join(u'|'), u"|0 a.card /dana/a.card||0 b.card /b.card||0 not mounted /dana/not mounted"_s);
     EXPECT_TRUE(MediaFolders::isMountPoint("/proc"));
     EXPECT_FALSE(MediaFolders::isMountPoint(root) || MediaFolders::isMountPoint("/nowhere"));
+}
+
+TEST(Cards, WaitForNoServiceThatHangs) {
+    struct Hanging : RemovableMedia {
+        void begin() override {
+            begun->release();
+            goesOn->acquire();
+        }
+        std::shared_ptr<std::binary_semaphore> begun, goesOn;
+    };
+    const auto begun = std::make_shared<std::binary_semaphore>(0);
+    const auto goesOn = std::make_shared<std::binary_semaphore>(0);
+    Cards cards([&] {
+        auto media = std::make_unique<Hanging>();
+        media->begun = begun;
+        media->goesOn = goesOn;
+        return media;
+    });
+    {
+        const Cards::Watch watch(cards);
+        begun->acquire();
+    }
+    goesOn->release();
 }
 
 // The pictures are an hour apart, the first the oldest.

@@ -95,21 +95,25 @@ DrivePath Drives::programRoot() const {
     return DrivePath(QString(m_programLetter) + u":\\"_s);
 }
 
-void Drives::refreshMedia() {
+std::vector<HostPath> Drives::findMedia(const std::vector<HostPath>& roots) {
     std::vector<HostPath> found;
     std::set<std::pair<dev_t, ino_t>> seen;
-    for (const HostPath& root : m_mediaRoots) {
+    for (const HostPath& root : roots) {
         std::error_code error;
         std::vector<HostPath> here;
         for (fs::directory_iterator at(root, error), end; !error && at != end; at.increment(error))
             here.push_back(at->path());
         std::sort(here.begin(), here.end());
         for (const HostPath& folder : here) {
-            const bool isRoot = std::find(m_mediaRoots.begin(), m_mediaRoots.end(), folder) != m_mediaRoots.end();
+            const bool isRoot = std::find(roots.begin(), roots.end(), folder) != roots.end();
             if (!isRoot && holdsMedium(folder) && seen.insert(identity(folder)).second)
                 found.push_back(folder);
         }
     }
+    return found;
+}
+
+void Drives::giveLetters(const std::vector<HostPath>& found) {
     const auto isGone = [&](const auto& drive) {
         return std::find(found.begin(), found.end(), drive.second) == found.end();
     };

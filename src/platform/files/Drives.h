@@ -34,7 +34,11 @@ public:
     const HostPath& dataFolder() const { return m_dataFolder; }
 
     // Looks for media that were mounted or removed since the last call.
-    void refreshMedia();
+    void refreshMedia() { giveLetters(findMedia(m_mediaRoots)); }
+    // The same in two steps. A mount that is slow holds the first, which any thread may call.
+    static std::vector<HostPath> findMedia(const std::vector<HostPath>& roots);
+    void giveLetters(const std::vector<HostPath>& found);
+    const std::vector<HostPath>& mediaRoots() const { return m_mediaRoots; }
 
     struct Drive {
         QChar letter;

@@ -1,9 +1,18 @@
 #include "platform/media/Cards.h"
 
+#include <QDeadlineTimer>
+
 #include <algorithm>
+#include <chrono>
 #include <utility>
 
 namespace lumora {
+
+namespace {
+
+constexpr std::chrono::seconds patienceAtTheEnd(3);
+
+} // namespace
 
 struct Cards::Entry {
     Card card;
@@ -17,13 +26,15 @@ Cards::Cards(Source source, bool everyFormat)
 Cards::~Cards() {
     for (const auto& entry : m_cards)
         *entry->stop = true;
-    if (m_thread) {
-        m_thread->quit();
-        m_thread->wait();
-    }
-    for (QThread* counting : m_counts) {
-        counting->wait();
-        delete counting;
+    if (m_thread)
+        endThread();
+    // A thread that hangs is left behind: the program ends all the same.
+    const QDeadlineTimer patience(patienceAtTheEnd);
+    for (const std::vector<QThread*>& threads : {m_ending, m_counts}) {
+        for (QThread* thread : threads) {
+            if (thread->wait(patience))
+                delete thread;
+        }
     }
 }
 
@@ -31,12 +42,17 @@ void Cards::watch() {
     if (++m_watchers > 1 || !m_source)
         return;
     RemovableMedia* media = m_source().release();
-    m_thread = std::make_unique<QThread>();
-    media->moveToThread(m_thread.get());
-    connect(m_thread.get(), &QThread::started, media, &RemovableMedia::begin);
-    connect(m_thread.get(), &QThread::finished, media, &QObject::deleteLater);
-    connect(media, &RemovableMedia::found, this, [this, thread = m_thread.get()](const std::vector<Medium>& found) {
-        if (m_thread.get() == thread)
+    auto* thread = new QThread();
+    m_thread = thread;
+    media->moveToThread(thread);
+    connect(thread, &QThread::started, media, &RemovableMedia::begin);
+    connect(thread, &QThread::finished, media, &QObject::deleteLater);
+    connect(thread, &QThread::finished, this, [this, thread] {
+        std::erase(m_ending, thread);
+        thread->deleteLater();
+    });
+    connect(media, &RemovableMedia::found, this, [this, thread](const std::vector<Medium>& found) {
+        if (m_thread == thread)
             take(found);
     });
     m_thread->start();
@@ -45,12 +61,16 @@ void Cards::watch() {
 void Cards::unwatch() {
     if (--m_watchers > 0 || !m_thread)
         return;
-    m_thread->quit();
-    m_thread->wait();
-    m_thread.reset();
+    endThread();
     // Nobody is told: the last watcher may be half destroyed.
     while (!m_cards.empty())
         forget(m_cards.size() - 1);
+}
+
+// Nobody waits for it: a bus or a card that hangs would hold the window.
+void Cards::endThread() {
+    m_thread->quit();
+    m_ending.push_back(std::exchange(m_thread, nullptr));
 }
 
 std::vector<Cards::Card> Cards::all() const {
@@ -90,17 +110,23 @@ void Cards::forget(std::size_t entry) {
 void Cards::count(Entry& entry) {
     const auto summary = std::make_shared<CardSummary>();
     const auto stop = entry.stop;
-    QThread* counting = QThread::create([summary, stop, root = entry.card.medium.folder, every = m_everyFormat] {
-        *summary = summaryOfCard(root, *stop, every);
-    });
+    const auto looked = std::make_shared<std::function<void()>>();
+    QThread* counting =
+        QThread::create([summary, stop, looked, look = m_look, root = entry.card.medium.folder, every = m_everyFormat] {
+            *summary = summaryOfCard(root, *stop, every);
+            if (look)
+                *looked = look();
+        });
     m_counts.push_back(counting);
-    connect(counting, &QThread::finished, this, [this, counting, summary, stop] {
+    connect(counting, &QThread::finished, this, [this, counting, summary, stop, looked] {
         std::erase(m_counts, counting);
         counting->deleteLater();
         const auto card =
             std::find_if(m_cards.begin(), m_cards.end(), [&](const auto& counted) { return counted->stop == stop; });
         if (card == m_cards.end())
             return;
+        if (*looked)
+            (*looked)();
         (*card)->card.summary = *summary;
         Q_EMIT changed();
     });

@@ -9,6 +9,7 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <utility>
 
 namespace lumora {
 
@@ -24,6 +25,11 @@ public:
 
     // The lab wants cards to be shown.
     bool areWatched() const { return static_cast<bool>(m_source); }
+
+    // What is to be known of the machine before anybody hears what a card holds. look runs in the thread that counts;
+    // what it gives runs in this one.
+    using Look = std::function<std::function<void()>()>;
+    void setLook(Look look) { m_look = std::move(look); }
 
     // While one of these lives, media are looked for and, where nobody has mounted them, mounted.
     class Watch {
@@ -54,6 +60,7 @@ private:
     struct Entry;
     void watch();
     void unwatch();
+    void endThread();
     void take(const std::vector<Medium>& media);
     void count(Entry& entry);
     void forget(std::size_t entry);
@@ -61,7 +68,9 @@ private:
     Source m_source;
     bool m_everyFormat;
     int m_watchers = 0;
-    std::unique_ptr<QThread> m_thread; // the source lives in it
+    Look m_look;
+    QThread* m_thread = nullptr;    // the source lives in it
+    std::vector<QThread*> m_ending; // of former watches; a service that hangs holds its thread
     std::vector<std::unique_ptr<Entry>> m_cards;
     std::vector<QThread*> m_counts; // also of cards that have gone
 };
