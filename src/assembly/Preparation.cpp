@@ -3,6 +3,7 @@
 #include "assembly/edited/KeptWork.h"
 #include "common/FixedText.h"
 #include "order/BasketLine.h"
+#include "order/KeptPictures.h"
 #include "order/PrintCode.h"
 #include "order/PrintFileName.h"
 #include "order/UnfinishedOrders.h"
@@ -137,6 +138,7 @@ bool Preparation::forEachPicture(const std::function<void(int)>& step) {
 
 bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
                        const std::function<Result<QByteArray>()>& picture) {
+    const KeptPictures kept(m_platform.files, m_state.keptFolder);
     const int failuresBefore = m_writeFailures;
     const PrintPacker::Outcome outcome = packer.pack(line, picture);
     if (outcome.packed)
@@ -144,9 +146,9 @@ bool Preparation::pack(PrintPacker& packer, const PrintPacker::Line& line,
     else if (outcome.writeFailure || m_writeFailures > failuresBefore)
         notPrepared(line.path, LeftOut::Why::NotWritten);
     else
-        notPrepared(line.path, HasQuestionMark(line.path.text())        ? LeftOut::Why::Name
-                               : m_platform.files.fileExists(line.path) ? LeftOut::Why::Damaged
-                                                                        : LeftOut::Why::Gone);
+        notPrepared(line.path, HasQuestionMark(line.path.text())                     ? LeftOut::Why::Name
+                               : m_platform.files.fileExists(kept.fileOf(line.path)) ? LeftOut::Why::Damaged
+                                                                                     : LeftOut::Why::Gone);
     if (outcome.writeFailure)
         notWritten(*outcome.writeFailure);
     if (outcome.removeFailure) {

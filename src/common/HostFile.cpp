@@ -148,6 +148,14 @@ void NewContent::append(const char* bytes, std::size_t count) {
     }
 }
 
+void NewContent::setTime(std::filesystem::file_time_type time) {
+    std::error_code refused;
+    if (m_error == 0)
+        std::filesystem::last_write_time(m_temporary, time, refused);
+    if (refused)
+        m_error = refused.value();
+}
+
 Result<void> NewContent::commit(Durability durability) {
     const bool synced = durability == Durability::Synced;
     if (synced && m_error == 0 && ::fsync(m_file.number()) != 0)

@@ -59,6 +59,8 @@ public:
     // A failure is kept until commit and what is appended behind it is dropped.
     void append(const char* bytes, std::size_t count);
     bool failed() const { return m_error != 0; }
+    // The time that the file will have, instead of that of its writing.
+    void setTime(std::filesystem::file_time_type time);
 
     // Syncs and renames. A passing file, which is of no use after a crash, need not wait for the disk. Where the
     // folder's sync alone has failed, the new content stands under its name.

@@ -18,13 +18,13 @@ DrivePath doorFolders(const Files& files) {
     return files.drives().programRoot() / u"2000lumora\\zmany\\door";
 }
 
-// The folders of orders to which the lines' paths lead. A customer's card may hold a copy of a workspace, so that the
-// drive counts too.
-QSet<QString> foldersOf(const QStringList& lines, const Files& files) {
+// The folders of orders to which the paths of an order lead. A customer's card may hold a copy of a workspace, so that
+// the drive counts too.
+QSet<QString> foldersOf(const OrderState& order, const Files& files) {
     static const QRegularExpression name(u"^[0-9a-f]{12}(?=\\\\)"_s);
     const QString before = doorFolders(files).text() + u'\\';
     QSet<QString> folders;
-    for (const QString& line : lines) {
+    for (const QString& line : order.items + QStringList(order.keptIn + u'\\')) {
         const qsizetype at = line.indexOf(before);
         const QString found = at < 0 ? QString() : name.match(line.mid(at + before.size())).captured();
         if (!found.isEmpty())
@@ -39,8 +39,8 @@ DrivePath newDoorFolder(const Files& files) {
     return doorFolders(files) / QUuid::createUuid().toString(QUuid::Id128).left(12);
 }
 
-void removeDoorFolders(const Files& files, const QStringList& lines) {
-    for (const QString& folder : foldersOf(lines, files))
+void removeDoorFolders(const Files& files, const OrderState& order) {
+    for (const QString& folder : foldersOf(order, files))
         static_cast<void>(files.removeTree(DrivePath(folder))); // the next start tries again
 }
 
@@ -56,7 +56,7 @@ void tidyDoorFolders(const SessionState& state, const Files& files) {
         const bool leaves = order && order->way != OrderState::Way::Station && order->way != OrderState::Way::Mail;
         if (order &&
             (order->phase == OrderState::Phase::Preparing || (leaves && order->phase < OrderState::Phase::Sending)))
-            needed += foldersOf(order->items, files);
+            needed += foldersOf(*order, files);
     }
     for (const QString& name : names) {
         if (const DrivePath folder = all / name; !needed.contains(folder.text()))

@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "imaging/files/PictureFile.h"
+#include "order/KeptPictures.h"
 #include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
@@ -20,7 +21,8 @@ QList<LeftOut> LeftOutOf(const QStringList& failed) {
 }
 
 Bitmap SmallLeftOut(const SessionState& state, const Files& files, int index, int cell) {
-    const Result<HostPath> path = files.host(state.transfer.leftOut.value(index).picture);
+    const KeptPictures kept(files, state.keptFolder);
+    const Result<HostPath> path = files.host(kept.fileOf(state.transfer.leftOut.value(index).picture));
     if (!path)
         return {};
     const std::vector<Result<Bitmap>> small = loadSmallPictures({*path}, cell);

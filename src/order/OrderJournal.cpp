@@ -2,6 +2,7 @@
 
 #include "order/BasketLine.h"
 #include "order/DoorFolders.h"
+#include "order/KeptPictures.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderNames.h"
@@ -73,12 +74,13 @@ Result<void> OrderJournal::keep(const OrderState& next) {
 }
 
 // An order that goes on keeps the marks of its first start: another picture may stand at a path by now.
-QStringList OrderJournal::marksOf(const QStringList& lines, OrderKind kind) const {
+QStringList OrderJournal::marksOf(const QStringList& lines, const SessionState& session) const {
     if (lines == m_state.items && m_state.marks.size() == lines.size())
         return m_state.marks;
+    const KeptPictures kept(m_files, session.keptFolder);
     QStringList marks;
     for (const QString& line : lines)
-        marks += PictureMark(m_files, BasketLine::split(line, lineFormOf(kind)).path);
+        marks += PictureMark(m_files, kept.fileOf(BasketLine::split(line, lineFormOf(session.Optint)).path));
     return marks;
 }
 
@@ -90,7 +92,8 @@ Result<void> OrderJournal::begin(const SessionState& session, Way way, const QSt
     next.kind = session.Optint;
     next.way = way;
     next.items = lines;
-    next.marks = marksOf(lines, session.Optint);
+    next.keptIn = session.keptFolder.text();
+    next.marks = marksOf(lines, session);
     next.choices = ChoicesOf(session);
     next.replaces = replaces.isEmpty() ? QString() : replaces.leaf();
     m_known = true;
@@ -125,7 +128,7 @@ Result<void> OrderJournal::sendingBegins(Sender by, bool ours) {
             static_cast<void>(m_files.removeTree(aside)); // hidden, and never sent
     }
     if (kept && isFirst)
-        removeDoorFolders(m_files, m_state.items);
+        removeDoorFolders(m_files, m_state);
     return kept;
 }
 

@@ -70,7 +70,7 @@ public:
     Result<void> replacesNone();
 
 private:
-    QStringList marksOf(const QStringList& lines, OrderKind kind) const;
+    QStringList marksOf(const QStringList& lines, const SessionState& session) const;
     void expectTheWorst();
     void makeKnown();
     Result<void> keep(const OrderState& next);

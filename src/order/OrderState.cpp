@@ -122,6 +122,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         state.why.english = value;
     else if (key == u"Replaces")
         state.replaces = value;
+    else if (key == u"KeptIn")
+        state.keptIn = value;
     else if (key == u"InHand")
         state.filesInHand += value;
     else if (key == u"Shoora")
@@ -181,6 +183,8 @@ QByteArray OrderState::write() const {
     for (auto length = lengths.cbegin(); length != lengths.cend(); ++length)
         writer.text(u"Length"_s, QString::number(length.value()) + u' ' + length.key());
     if (phase <= Phase::Prepared) {
+        if (!keptIn.isEmpty())
+            writer.text(u"KeptIn"_s, keptIn);
         for (const QString& item : items)
             writer.text(u"Shoora"_s, item);
         for (const QString& mark : marks)

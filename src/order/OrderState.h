@@ -61,6 +61,7 @@ struct OrderState {
     bool givenUp = false; // the staff wants it sent by itself no more
     QString replaces;     // folder name of the order that this one was prepared again from
     QStringList items;    // lines of the basket; kept until the sending begins
+    QString keptIn;       // the folder of KeptPictures; empty without one; kept as long as the lines
     QStringList marks;    // PictureMark of each line's picture; none in a state of an older version
     // Of the prints and pieces, by leaf name, in bytes: as they were prepared. None in a state of an older version.
     QMap<QString, qint64> lengths;

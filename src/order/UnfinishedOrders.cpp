@@ -5,6 +5,7 @@
 #include "order/DoorFolders.h"
 #include "order/EditRecord.h"
 #include "order/FinishedOrder.h"
+#include "order/KeptPictures.h"
 #include "order/LeftOutPictures.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
@@ -34,6 +35,10 @@ using Way = OrderState::Way;
 
 namespace {
 
+KeptPictures keptBy(const OrderState& order, const Files& files) {
+    return {files, DrivePath(order.keptIn)};
+}
+
 // A corrected copy is there also where only the order has kept it.
 bool pictureIsThere(const OrderFolder& folder, const OrderState& order, qsizetype line, const SessionState& state,
                     const Files& files) {
@@ -41,7 +46,7 @@ bool pictureIsThere(const OrderFolder& folder, const OrderState& order, qsizetyp
     const BasketLine item = BasketLine::split(order.items[line], form);
     const DrivePath picture = PictureOf(item, form, state);
     if (picture == item.path)
-        return files.fileExists(picture) && !IsOtherPicture(state, files, order, line);
+        return files.fileExists(keptBy(order, files).fileOf(picture)) && !IsOtherPicture(state, files, order, line);
     return files.fileExists(picture) || files.fileExists(KeptWorkFolder(folder, picture.folder()) / picture.leaf());
 }
 
@@ -209,7 +214,7 @@ bool IsOtherPicture(const SessionState& state, const Files& files, const OrderSt
     const BasketLine item = BasketLine::split(order.items[line], form);
     if (mark.isEmpty() || PictureOf(item, form, state) != item.path)
         return false;
-    const QString now = PictureMark(files, item.path);
+    const QString now = PictureMark(files, keptBy(order, files).fileOf(item.path));
     return !now.isEmpty() && now != mark;
 }
 
@@ -239,6 +244,7 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
 
 Outcome TakeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files) {
     TakeChoices(order.state.choices, state);
+    state.keptFolder = DrivePath(order.state.keptIn);
     if (order.state.phase == Phase::Preparing) {
         takeUpPreparation(order, state);
         return printsAsTheyAre(order.state.kind) ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;
@@ -261,7 +267,7 @@ Result<void> ThrowAwayOrder(const Files& files, const OrderFolder& folder) {
     const Result<OrderState> order = ReadOrderState(files, folder);
     Result<void> removed = files.removeTree(folder.path());
     if (removed && order && order->phase < Phase::Sending)
-        removeDoorFolders(files, order->items);
+        removeDoorFolders(files, *order);
     return removed;
 }
 

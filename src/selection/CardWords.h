@@ -15,6 +15,16 @@ struct CardWords {
 };
 
 CardWords cardWords(const Cards::Card& card, QDate today, bool english);
+// How far the copying of what was chosen from cards has come.
+struct CopyCount {
+    qsizetype kept = 0;
+    qsizetype waiting = 0;
+    qsizetype missing = 0; // a card was pulled too early
+    qsizetype onCard = 0;  // can't be copied, and is read from the card
+    bool isIn = false;     // a card with one that is kept
+};
+// Empty where there is nothing to tell.
+QString copyWords(const CopyCount& count, bool english);
 // Where no card is in.
 CardWords noCardWords(bool english);
 // A day as customers say it.

@@ -55,6 +55,23 @@ CardWords cardWords(const Cards::Card& card, QDate today, bool english) {
     return words;
 }
 
+QString copyWords(const CopyCount& count, bool english) {
+    if (count.missing == 1)
+        return english ? u"1 picture is missing: please put the card in again"_s
+                       : u"תמונה אחת חסרה: נא להכניס שוב את הכרטיס"_s;
+    if (count.missing > 0)
+        return (english ? u"%1 pictures are missing: please put the card in again"_s
+                        : u"%1 תמונות חסרות: נא להכניס שוב את הכרטיס"_s)
+            .arg(count.missing);
+    if (count.waiting > 0)
+        return (english ? u"Please leave the card in: %1 of %2 copied"_s : u"נא להשאיר את הכרטיס: הועתקו %1 מתוך %2"_s)
+            .arg(count.kept)
+            .arg(count.kept + count.waiting + count.onCard);
+    if (count.onCard > 0)
+        return english ? u"Please leave the card in"_s : u"נא להשאיר את הכרטיס"_s;
+    return !count.isIn ? QString() : english ? u"You may take the card out now"_s : u"אפשר להוציא את הכרטיס עכשיו"_s;
+}
+
 CardWords noCardWords(bool english) {
     return {english ? u"Put in a memory card or a stick, and it shows here"_s
                     : u"כרטיס זיכרון או התקן USB שיוכנס יופיע כאן"_s,

@@ -2,6 +2,7 @@
 
 #include "order/BasketLine.h"
 #include "order/EditRecord.h"
+#include "order/KeptPictures.h"
 #include "platform/files/Files.h"
 #include "selection/Basket.h"
 #include "selection/FinishRule.h"
@@ -18,7 +19,7 @@ PaperFit OrderResolution::fit() const {
 }
 
 void OrderResolution::look(const QString& path) {
-    const std::optional<HostPath> file = m_files.drives().toHost(DrivePath(path));
+    const std::optional<HostPath> file = KeptPictures(m_files, m_state.keptFolder).hostOf(DrivePath(path));
     const Result<PictureSize> size = file ? readPictureSize(*file) : Result<PictureSize>(Failure{});
     m_sizes[path] = size ? std::optional(*size) : std::nullopt;
 }

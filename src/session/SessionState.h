@@ -269,6 +269,7 @@ struct SessionState {
     EditFields edit;
     TransferState transfer;
     HandOver handOver;
+    DrivePath keptFolder; // where copies of the order's pictures lie that were chosen from cards (order/KeptPictures.h)
 
     bool english() const { return EnglishTips == 1; }
     // The wording in the language of the session.

@@ -180,6 +180,7 @@ FAULTS = {
         F('static_cast<void>(files.removeFile(thumbnails / name));', 'static_cast<void>(name);', 'the next sheet shows pictures of the one before', seen=True),
         F('HasQuestionMark(path) ? LeftOut::Why::Name : LeftOut::Why::NotTold', 'LeftOut::Why::NotTold',
           'nobody is told that the name of a picture is at fault')],
+    'src/order/KeptPictures.cpp': [F('!made && has(picture) ? copyOf(picture) : picture', 'picture', 'what was copied is lost with its card')],
     'src/order/LineEnds.cpp': [F('return {-cr, -crlf, lf, lf - crlf};', 'return {-cr, -crlf, lf, lf};', 'a server that adds CR is not recognised')],
 
     'src/platform/line/FtpListing.cpp': [
@@ -280,6 +281,11 @@ FAULTS = {
         F('resolution->grade() == PrintResolution::Grade::Coarse', 'resolution->grade() != PrintResolution::Grade::Sharp',
           'fair pictures are called coarse'),
         F('record.isEmpty() ? EditRecord::newPicture() : record', 'EditRecord::newPicture()', 'a zoomed picture is not told to be coarse')],
+    'src/selection/CardCopies.cpp': [
+        F('(copied != picture.source.stamp.length || stampOf(picture.source.file) != picture.source.stamp)', 'false', 'half a picture counts as copied')],
+    'src/selection/pictures/kyoskNewCopies.cpp': [
+        F('count.waiting += state == CopyState::Waiting;', '', 'the card may be taken out too early')],
+    'src/selection/door/PictureDoor.cpp': [F('return copied != picture.source.stamp;', 'return false;', 'the picture of another card is printed')],
     'src/selection/SeenPages.cpp': [
         F('m_pages.back().start >= lines', 'false', 'the page of pictures that are no longer chosen comes back empty'),
         F('m_state.Careful && start + cellsOfPage >= lines', 'false', 'one of many chosen pictures is shown')],

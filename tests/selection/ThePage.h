@@ -7,7 +7,12 @@
 #include "session/Workspace.h"
 #include "support/PageRig.h"
 
+#include <QElapsedTimer>
+#include <QGuiApplication>
+
 #include <gtest/gtest.h>
+
+#include <functional>
 
 namespace lumora {
 
@@ -33,6 +38,12 @@ protected:
     void pick(kyoskNew& page, const QString& picture) {
         machine.dialogs.picks += DrivePath(picture);
         page.Image5_Click();
+    }
+    static void waitUntil(const std::function<bool()>& done) {
+        QElapsedTimer clock;
+        for (clock.start(); !done() && clock.elapsed() < 60'000;)
+            QGuiApplication::processEvents(QEventLoop::AllEvents, 50);
+        ASSERT_TRUE(done());
     }
 };
 

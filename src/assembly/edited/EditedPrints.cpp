@@ -4,6 +4,7 @@
 #include "editing/render/EditedPicture.h"
 #include "imaging/files/BmpFile.h"
 #include "order/EditRecord.h"
+#include "order/KeptPictures.h"
 #include "order/UnfinishedOrders.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
@@ -57,7 +58,8 @@ EditedPrints::Ahead::Work EditedPrints::rendering(const BasketLine& item) const 
     UnpackEditState(item.editState, edit);
     const Drives& drives = m_files.drives();
     const DrivePath source = PictureOf(item, LineForm::Full, m_state);
-    const std::optional<HostPath> file = HasQuestionMark(source.text()) ? std::nullopt : drives.toHost(source);
+    const std::optional<HostPath> file =
+        HasQuestionMark(source.text()) ? std::nullopt : KeptPictures(m_files, m_state.keptFolder).hostOf(source);
     const std::optional<HostPath> copy = drives.toHost(WorkspacePaths::toneCopy(m_state));
     if (!m_paper || !file || !copy)
         return [source]() -> EditedPrintResult { return {Failure{Failure::Kind::NotFound, source.text()}}; };

@@ -6,6 +6,7 @@
 #include "imaging/files/PictureFile.h"
 #include "order/BasketLine.h"
 #include "order/EditRecord.h"
+#include "order/KeptPictures.h"
 #include "order/UnfinishedOrders.h"
 #include "platform/files/Files.h"
 #include "session/SessionState.h"
@@ -30,7 +31,8 @@ QString OpenedRecords::recordOf(const BasketLine& line) const {
     UnpackEditState(line.editState.trimmed().isEmpty() ? EditRecord::newPicture() : line.editState, edit);
     if (!isPanUnset(edit))
         return line.editState;
-    const std::optional<HostPath> file = m_files.drives().toHost(PictureOf(line, LineForm::Full, m_state));
+    const std::optional<HostPath> file =
+        KeptPictures(m_files, m_state.keptFolder).hostOf(PictureOf(line, LineForm::Full, m_state));
     const Result<PictureSize> size = file ? readPictureSize(*file) : Result<PictureSize>(Failure{});
     if (!size)
         return line.editState;

@@ -6,6 +6,7 @@
 #include "common/PaperSize.h"
 #include "imaging/files/JpegCheck.h"
 #include "order/BasketLine.h"
+#include "order/KeptPictures.h"
 #include "order/OrderNames.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -38,6 +39,7 @@ class PlainPreparation::Prints {
 public:
     Prints(const SessionState& state, const Files& files, const QStringList& items, const QSet<int>& there)
         : m_files(files)
+        , m_kept(files, state.keptFolder)
         , m_paper(PaperSize::ofText(state.shemot.ppr))
         , m_sources(sourcesToPrint(items, there))
         , m_prints(static_cast<int>(m_sources.size()),
@@ -64,7 +66,7 @@ private:
     }
 
     Ahead::Work scaling(const DrivePath& path) const {
-        const std::optional<HostPath> source = m_files.drives().toHost(path);
+        const std::optional<HostPath> source = m_kept.hostOf(path);
         return [source, paper = m_paper]() -> Result<QByteArray> {
             if (!source || !paper)
                 return Failure{Failure::Kind::NotFound, {}};
@@ -72,7 +74,8 @@ private:
         };
     }
 
-    Ahead::Work copying(const DrivePath& path, bool decoded) const {
+    Ahead::Work copying(const DrivePath& picture, bool decoded) const {
+        const DrivePath path = m_kept.fileOf(picture);
         const Result<HostPath> source = m_files.host(path);
         return [source, path, decoded, files = &m_files]() -> Result<QByteArray> {
             if (!source)
@@ -83,6 +86,7 @@ private:
     }
 
     const Files& m_files;
+    const KeptPictures m_kept;
     const std::optional<PaperSize> m_paper;
     const QList<DrivePath> m_sources;
     Ahead m_prints;
@@ -106,9 +110,10 @@ bool PlainPreparation::isAlbum() const {
 std::optional<Bitmap> PlainPreparation::drawSheet(SheetKind kind, const QStringList& lines) {
     const QDateTime now = m_platform.clock.now();
     std::vector<SheetCell> cells;
+    const KeptPictures kept(m_platform.files, m_state.keptFolder);
     for (const QString& line : lines)
-        cells.push_back({m_platform.files.drives().toHost(split(line).path),
-                         split(line).copiesField() + u'_' + RightPart(split(line).path.stem(), 9)});
+        cells.push_back(
+            {kept.hostOf(split(line).path), split(line).copiesField() + u'_' + RightPart(split(line).path.stem(), 9)});
     return Preparation::drawSheet(
         kind, lines, kind == SheetKind::Album ? albumSheetLines(m_state, now) : plainSheetLines(m_state, now), cells);
 }

@@ -1,6 +1,7 @@
 #include "editing/editor/Form3.h"
 
 #include "imaging/drawing/Drawing.h"
+#include "order/KeptPictures.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -71,7 +72,7 @@ void Form3::draw() {
 }
 
 Result<Bitmap> Form3::read() {
-    const std::optional<HostPath> file = m_platform.files.drives().toHost(m_path);
+    const std::optional<HostPath> file = KeptPictures(m_platform.files, m_state.keptFolder).hostOf(m_path);
     if (!file)
         return Failure{Failure::Kind::NotFound, m_path.text()};
     const auto size = readPictureSize(*file);

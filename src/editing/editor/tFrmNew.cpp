@@ -5,6 +5,7 @@
 #include "editing/editor/BigPics.h"
 #include "editing/render/EditedPicture.h"
 #include "order/EditRecord.h"
+#include "order/KeptPictures.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -155,8 +156,9 @@ bool tFrmNew::loadPictureOfRecord() {
 
 bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
     const PaperSize paper = *PaperSize::ofDigits(PaperSizeCode);
+    const HostPath file = KeptPictures(m_platform.files, m_state.keptFolder).hostOf(path).value_or(HostPath());
     Result<EditedPreview> opened =
-        EditedPreview::open(hostOf(path), paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
+        EditedPreview::open(file, paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
         tell(u"לא ניתן לפתוח את התמונה לעריכה"_s, u"The picture can't be opened for editing"_s,
              failureWords(m_state, opened.failure()));

@@ -4,6 +4,7 @@
 #include "editing/editor/tFrmNew.h"
 #include "editing/redeye/RedOverview.h"
 #include "order/EditRecord.h"
+#include "order/KeptPictures.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -77,8 +78,9 @@ void RedI::open(const DrivePath& path) {
         RedEyePicture::Originals originals;
     };
     const Drives& drives = m_platform.files.drives();
-    const auto load = [&drives](const DrivePath& from) -> Result<Bitmap> {
-        const std::optional<HostPath> host = drives.toHost(from);
+    const auto load =
+        [kept = KeptPictures(m_platform.files, m_state.keptFolder)](const DrivePath& from) -> Result<Bitmap> {
+        const std::optional<HostPath> host = kept.hostOf(from);
         Result<Bitmap> picture = host ? loadPicture(*host) : Failure{Failure::Kind::NotFound, from.text()};
         if (!picture)
             return picture;

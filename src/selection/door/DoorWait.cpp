@@ -22,9 +22,10 @@ DoorWait::DoorWait(const SessionState& state, const PictureDoor& door)
     : m_state(state)
     , m_door(door) {}
 
-DoorWait::Then DoorWait::count(const QStringList& chosen) {
+DoorWait::Then DoorWait::count(const QStringList& chosen, const std::function<bool(const QString&)>& isCopied) {
     m_chosen = chosen.size();
-    m_waiting = std::ranges::count_if(chosen, [this](const QString& path) { return m_door.isWaiting(path); });
+    m_waiting = std::ranges::count_if(
+        chosen, [&](const QString& path) { return m_door.isWaiting(path) || (isCopied && isCopied(path)); });
     const auto notMade = std::ranges::find_if(chosen, [this](const QString& path) { return m_door.isNotMade(path); });
     m_notMade = notMade == chosen.end() ? QString() : *notMade;
     m_waits = m_waiting > 0;

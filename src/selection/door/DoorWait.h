@@ -3,6 +3,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
+
 namespace lumora {
 
 class PictureDoor;
@@ -16,7 +18,8 @@ public:
 
     enum class Then { Wait, GoOn, TellNotMade };
     // The customer has pressed "finish", or one of the chosen paths has settled in a wait.
-    Then count(const QStringList& chosen);
+    // isCopied: of one that is being copied from a card, which is waited for too.
+    Then count(const QStringList& chosen, const std::function<bool(const QString&)>& isCopied = {});
     // The customer goes back to the pictures.
     void stop() { m_waits = false; }
     bool waits() const { return m_waits; }

@@ -70,6 +70,7 @@ PictureDoor::PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rule
     : m_files(files)
     , m_decoder(std::move(decoder))
     , m_rules(rules)
+    , m_kept(files, {})
     , m_desk(std::make_shared<Desk>()) {
     m_desk->door = this;
 }
@@ -88,10 +89,10 @@ const PictureDoor::Picture* PictureDoor::find(const QString& worked) const {
     return m_byWorked.value(worked);
 }
 
-PictureDoor::FileStamp PictureDoor::stampOf(const HostPath& path) {
-    std::error_code none;
-    const FileStamp stamp{std::filesystem::file_size(path, none), std::filesystem::last_write_time(path, none)};
-    return none ? FileStamp() : stamp;
+void PictureDoor::setFolder(const DrivePath& folder, bool keepsCards) {
+    m_folder = folder;
+    m_keepsCards = keepsCards;
+    m_kept.setOrderFolder(keepsCards ? folder : DrivePath());
 }
 
 // No other picture has the path, and what lies there was made of this one.
@@ -126,20 +127,49 @@ PictureDoor::Picture& PictureDoor::enter(const QString& listed) {
     Picture& picture = m_pictures.emplace_back();
     const DrivePath path(listed);
     picture.listed = listed;
-    picture.source = m_files.drives().toHost(path).value_or(HostPath());
-    picture.stamp = stampOf(picture.source);
+    picture.source.file = m_files.drives().toHost(path).value_or(HostPath());
+    picture.source.stamp = stampOf(picture.source.file);
     judge(picture);
-    picture.worked =
-        picture.state == State::InPlace || picture.state == State::Unreadable ? listed : planned(path, picture.source);
+    const bool another = isOfAnotherCard(picture);
+    if (another && picture.state == State::InPlace)
+        picture.state = State::Waiting;
+    const bool stays = !another && (picture.state == State::InPlace || picture.state == State::Unreadable);
+    picture.worked = stays ? listed : planned(path, picture.source.file);
     if (picture.state == State::Waiting &&
-        stampOf(m_files.drives().toHost(DrivePath(picture.worked)).value_or(HostPath())).time == picture.stamp.time)
+        stampOf(m_files.drives().toHost(DrivePath(picture.worked)).value_or(HostPath())).time ==
+            picture.source.stamp.time)
         picture.state = State::Ready;
     m_byListed[listed] = m_byWorked[picture.worked] = &picture;
     return picture;
 }
 
+// A chosen picture keeps its path, whichever card lies there by now.
+bool PictureDoor::isOfAnotherCard(const Picture& picture) const {
+    if (!m_keepsCards || !picture.source.stamp.isThere)
+        return false;
+    if (const PictureStamp copied = m_kept.copiedStamp(DrivePath(picture.listed)); copied.isThere)
+        return copied != picture.source.stamp;
+    const Picture* before = find(picture.listed);
+    return before && before->source.stamp.isThere && before->source.stamp != picture.source.stamp && m_isChosen &&
+           m_isChosen(picture.listed);
+}
+
+// The copy of what lay on a card, where there is one.
+HostPath PictureDoor::fileToRead(const Picture& picture) const {
+    const DrivePath worked(picture.worked);
+    return m_kept.has(worked) ? m_files.drives().toHost(m_kept.copyOf(worked)).value_or(HostPath())
+                              : picture.source.file;
+}
+
+// A card that is pulled in the middle gives half a picture, which is no fault of the picture.
+bool PictureDoor::canBeRead(const Picture& picture) const {
+    return !m_keepsCards || stampOf(picture.source.file) == picture.source.stamp;
+}
+
 void PictureDoor::judge(Picture& picture) {
-    const Result<DoorNeed> need = DoorDecoder::needOf(picture.source, m_rules);
+    if (!isOpen())
+        return;
+    const Result<DoorNeed> need = DoorDecoder::needOf(picture.source.file, m_rules);
     if (need) {
         const bool stays = *need == DoorNeed::Nothing && AnsiCodePage::holds(picture.listed);
         picture.state = stays ? State::InPlace : State::Waiting;
@@ -152,10 +182,20 @@ void PictureDoor::judge(Picture& picture) {
 }
 
 QString PictureDoor::worked(const QString& listed) {
-    if (!isOpen() || listed.isEmpty() || listed.startsWith(m_folder.text() + u'\\'))
+    if (m_folder.isEmpty() || listed.isEmpty() || listed.startsWith(m_folder.text() + u'\\'))
         return listed;
     const Picture* known = m_byListed.value(listed);
-    return known && stampOf(known->source) == known->stamp ? known->worked : enter(listed).worked;
+    if (known) {
+        const PictureStamp now = stampOf(known->source.file);
+        if (now == known->source.stamp || (m_keepsCards && !now.isThere))
+            return known->worked;
+    }
+    return enter(listed).worked;
+}
+
+const PictureSource* PictureDoor::sourceOf(const QString& worked) const {
+    const Picture* picture = find(worked);
+    return picture ? &picture->source : nullptr;
 }
 
 QString PictureDoor::shown(const QString& worked) const {
@@ -163,7 +203,7 @@ QString PictureDoor::shown(const QString& worked) const {
     if (picture)
         return picture->listed;
     // Of an order that was begun by another run the name alone is known.
-    return isOpen() && worked.startsWith(m_folder.text() + u'\\') ? LeafName(worked) : worked;
+    return !m_folder.isEmpty() && worked.startsWith(m_folder.text() + u'\\') ? LeafName(worked) : worked;
 }
 
 PictureDoor::State PictureDoor::stateOf(const QString& worked) const {
@@ -178,7 +218,8 @@ Failure PictureDoor::failureOf(const QString& worked) const {
 
 Bitmap PictureDoor::draft(const QString& worked, int cell) {
     Picture* picture = find(worked);
-    const HostPath source = picture ? picture->source : m_files.drives().toHost(DrivePath(worked)).value_or(HostPath());
+    const HostPath source =
+        picture ? fileToRead(*picture) : m_files.drives().toHost(DrivePath(worked)).value_or(HostPath());
     const bool isWaiting = picture && picture->state == State::Waiting;
     Bitmap draft = isWaiting && !picture->draft.isEmpty()
                        ? pictureDraft(picture->draft, cell)
@@ -190,7 +231,8 @@ Bitmap PictureDoor::draft(const QString& worked, int cell) {
 
 void PictureDoor::foundUnreadable(const QString& worked, const Failure& why) {
     Picture* picture = find(worked);
-    if (!picture || picture->state != State::InPlace || !m_rules.everyFormat || !isThePictures(why))
+    if (!picture || picture->state != State::InPlace || !m_rules.everyFormat || !isThePictures(why) ||
+        !canBeRead(*picture))
         return;
     picture->state = State::Unreadable;
     picture->failure = why;
@@ -227,9 +269,10 @@ void PictureDoor::startNext() {
 void PictureDoor::start(Picture& picture) {
     const DrivePath path(picture.worked);
     picture.inHand = true;
+    picture.fromCopy = m_kept.has(path);
     ++m_running;
     const Result<HostPath> target = targetOf(path);
-    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = picture.source, target,
+    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = fileToRead(picture), target,
                       stop = m_stop.get_token()] {
         const Result<qint64> made = target ? makePicture(decoder, source, *target, stop) : target.failure();
         const std::lock_guard lock(desk->mutex);
@@ -285,8 +328,13 @@ void PictureDoor::settle(const QString& worked, const Result<qint64>& made) {
         m_made += worked;
         makeRoom();
     } else {
+        if (!picture.fromCopy && m_kept.has(DrivePath(worked))) {
+            m_wanted.prepend(worked); // the card went meanwhile
+            return startNext();
+        }
         picture.failure = made.failure();
-        picture.state = isThePictures(made.failure()) ? State::Unreadable : State::NotMade;
+        picture.state = isThePictures(made.failure()) && (picture.fromCopy || canBeRead(picture)) ? State::Unreadable
+                                                                                                  : State::NotMade;
     }
     startNext();
     Q_EMIT settled(worked);
@@ -298,7 +346,8 @@ void PictureDoor::makeRoom() {
         taken += find(worked)->bytes;
     for (qsizetype i = 0; i + 1 < m_made.size() && taken > m_room;) {
         Picture& picture = *find(m_made[i]);
-        if ((m_isKept && m_isKept(picture.worked)) || !m_files.removeFile(DrivePath(picture.worked))) {
+        if ((m_isChosen && m_isChosen(picture.worked)) || (m_isInView && m_isInView(picture.worked)) ||
+            !m_files.removeFile(DrivePath(picture.worked))) {
             ++i;
             continue;
         }

@@ -5,13 +5,13 @@
 #include "common/Result.h"
 #include "door/DoorDecoder.h"
 #include "imaging/Bitmap.h"
+#include "order/KeptPictures.h"
 #include "platform/files/HostPath.h"
 
 #include <QHash>
 #include <QObject>
 #include <QStringList>
 
-#include <cstdint>
 #include <deque>
 #include <functional>
 #include <memory>
@@ -19,8 +19,6 @@
 #include <utility>
 
 namespace lumora {
-
-class Files;
 
 // Stands between the pictures that a customer brings and the pages: a page lists the customer's own files, and works
 // with a .jpg in the code page in the place of each. That is the file itself where it needs nothing; else a file of the
@@ -39,8 +37,9 @@ public:
     PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rules);
     ~PictureDoor() override;
 
-    // The folder of the order. A page calls it before anything else.
-    void setFolder(const DrivePath& folder) { m_folder = folder; }
+    // The folder of the order. A page calls it before anything else. With keepsCards a picture whose card was taken out
+    // stays what it was, and one of another card at the path of a chosen one gets a path of its own.
+    void setFolder(const DrivePath& folder, bool keepsCards);
     const DrivePath& folder() const { return m_folder; }
     // As built in, each file stands for itself.
     bool isOpen() const { return m_rules.any(); }
@@ -48,6 +47,8 @@ public:
     // The path that the pages work with in the place of a listed one; a path that is one already stays. Reads the
     // header of a file that it has not seen before.
     QString worked(const QString& listed);
+    // Null for a path that no folder has shown.
+    const PictureSource* sourceOf(const QString& worked) const;
     // The customer's own path.
     QString shown(const QString& worked) const;
 
@@ -68,9 +69,11 @@ public:
     // What is waiting among these is made in this order, and nothing else any more.
     void want(const QStringList& worked);
 
-    // The order's folder has room for so many bytes: what was made first goes first, but for what this keeps.
-    void setKept(std::function<bool(const QString& worked)> isKept, qint64 room = qint64(2) << 30) {
-        m_isKept = std::move(isKept);
+    // The order's folder has room for so many bytes: what was made first goes first, but for what is chosen or in view.
+    using Is = std::function<bool(const QString& worked)>;
+    void setKept(Is isChosen, Is isInView, qint64 room = qint64(2) << 30) {
+        m_isChosen = std::move(isChosen);
+        m_isInView = std::move(isInView);
         m_room = room;
     }
 
@@ -81,22 +84,15 @@ Q_SIGNALS:
     void drafted(const QString& worked);
 
 private:
-    // Another card may lie at the same path by now.
-    struct FileStamp {
-        std::uintmax_t length = 0;
-        std::filesystem::file_time_type time;
-        bool operator==(const FileStamp&) const = default;
-    };
-    static FileStamp stampOf(const HostPath& path);
     struct Picture {
         QString listed;
         QString worked;
-        HostPath source;
-        FileStamp stamp; // of the source, when it was looked at
+        PictureSource source;
         State state = State::InPlace;
         Failure failure;
         qint64 bytes = 0;
-        bool inHand = false; // it is being made
+        bool inHand = false;   // it is being made
+        bool fromCopy = false; // of what lay on a card
         bool draftAsked = false;
         QByteArray draft; // a JPEG file, while the picture is waiting
     };
@@ -107,6 +103,9 @@ private:
     Picture& enter(const QString& listed);
     QString planned(const DrivePath& listed, const HostPath& source);
     bool isFree(const DrivePath& made, const HostPath& source) const;
+    bool isOfAnotherCard(const Picture& picture) const;
+    HostPath fileToRead(const Picture& picture) const;
+    bool canBeRead(const Picture& picture) const;
     void judge(Picture& picture);
     void startNext();
     void start(Picture& picture);
@@ -120,6 +119,8 @@ private:
     DoorDecoder m_decoder;
     DoorRules m_rules;
     DrivePath m_folder;
+    bool m_keepsCards = false;
+    KeptPictures m_kept;
     std::deque<Picture> m_pictures;
     QHash<QString, Picture*> m_byListed;
     QHash<QString, Picture*> m_byWorked;
@@ -127,7 +128,8 @@ private:
     QStringList m_wanted;
     QStringList m_draftsWanted;
     QStringList m_made; // the oldest first
-    std::function<bool(const QString&)> m_isKept;
+    Is m_isChosen;
+    Is m_isInView;
     qint64 m_room = qint64(2) << 30;
     int m_running = 0;
     std::stop_source m_stop; // of what is being made

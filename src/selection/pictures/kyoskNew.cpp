@@ -38,6 +38,7 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
 
 // Nothing leads any more to what was made for an order that was not handed over.
 kyoskNew::~kyoskNew() {
+    m_copies.reset();
     if (!m_handedOver && !m_door->folder().isEmpty())
         static_cast<void>(m_platform.files.removeTree(m_door->folder()));
 }
@@ -92,6 +93,8 @@ void kyoskNew::load() {
 void kyoskNew::takeBack(const HandOver& before) {
     m_tookBack = true;
     m_choice.takeBack(before.basket, before.pictures);
+    for (const QString& path : m_choice.basket().paths())
+        m_door->worked(path);
     m_choice.nextPage();
     showPictureCount();
     showGuide(Guide::PicturesShown);
@@ -120,6 +123,7 @@ void kyoskNew::showChoice() {
     Image16.enabled = m_choice.hasNextPage();
     for (int cell = 0; cell < cellsOfPage; ++cell)
         showCell(cell);
+    copyChosen(false);
     showCards();
     Q_EMIT changed();
 }

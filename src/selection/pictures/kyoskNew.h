@@ -3,6 +3,7 @@
 #include "order/MailAddressGuard.h"
 #include "platform/files/Files.h"
 #include "platform/media/Cards.h"
+#include "selection/CardCopies.h"
 #include "selection/FinishRule.h"
 #include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
@@ -148,6 +149,20 @@ private:
     void watchCards();
     void showCards();
     void openCard();
+    const PictureSource* onCard(const QString& path) const;
+    bool isIn(const PictureSource& picture) const;
+    CardCopies::State copyState(const QString& path) const;
+    QStringList chosenOnCards(CardCopies::State state) const;
+    void copyChosen(bool again);
+    void noteCards();
+    void cardsChanged();
+    void copySettled(const QString& path);
+    void tellNotKept(const Failure& why);
+    void tellMissing();
+    void askForMissing();
+    bool isCopied(const QString& path) const;
+    void showCopies();
+    QString namesOf(const QStringList& paths) const;
     void turnPage(const std::function<void()>& step);
     void showPictureCount();
     void turnTo(void (PictureChoice::*page)());
@@ -244,6 +259,11 @@ private:
     SmallPictures m_small;
     FileList File1;
     std::optional<Cards::Watch> m_watch;
+    std::unique_ptr<CardCopies> m_copies; // none where the lab shows no cards
+    std::vector<HostPath> m_cardFolders;  // of all cards that were in
+    std::vector<HostPath> m_cardsIn;
+    QStringList m_missingTold; // chosen pictures that a card was pulled with
+    bool m_notKeptTold = false;
     DrivePath m_cardPicture; // the newest of the card that is offered; empty when none can be opened
     Ticker Timer1;
     Ticker Timer2;

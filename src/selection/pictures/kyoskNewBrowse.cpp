@@ -3,6 +3,7 @@
 #include "editing/editor/Form3.h"
 #include "editing/render/StoredSmallView.h"
 #include "imaging/files/PictureFile.h"
+#include "order/KeptPictures.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
@@ -27,7 +28,7 @@ constexpr int drawnAtOnce = 2;
 } // namespace
 
 HostPath kyoskNew::hostOf(const DrivePath& path) const {
-    return m_platform.files.drives().toHost(path).value_or(HostPath());
+    return KeptPictures(m_platform.files, m_state.keptFolder).hostOf(path).value_or(HostPath());
 }
 
 void kyoskNew::setCellPixels(int pixels) {

@@ -15,11 +15,14 @@ void kyoskNew::watchCards() {
         return;
     m_watch.emplace(m_platform.cards);
     connect(&m_platform.cards, &Cards::changed, this, [this] {
-        if (m_handedOver)
-            return;
-        showCards();
-        Q_EMIT changed();
+        if (!m_handedOver)
+            cardsChanged();
     });
+    connect(m_copies.get(), &CardCopies::settled, this, [this](const QString& path) {
+        if (!m_handedOver)
+            copySettled(path);
+    });
+    noteCards();
 }
 
 // The card that came last is offered, until its newest pictures are among those of the page.
@@ -45,6 +48,7 @@ void kyoskNew::showCards() {
     cardOffer.enabled = words.opens;
     cardOffer.text = words.head;
     cardNote.text = words.note;
+    showCopies();
 }
 
 void kyoskNew::openCard() {

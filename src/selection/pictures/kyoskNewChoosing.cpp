@@ -107,7 +107,7 @@ void kyoskNew::cancelPage() {
 void kyoskNew::chooseWholeFolder() {
     // A folder of thousands on a card takes a while to look at.
     const QStringList listed = m_choice.folders().paths().items();
-    for (qsizetype i = 0; m_door->isOpen() && i < listed.size(); ++i) {
+    for (qsizetype i = 0; !m_door->folder().isEmpty() && i < listed.size(); ++i) {
         m_door->worked(listed[i]);
         if (i % 16 == 15)
             m_platform.pump.pump();

@@ -73,9 +73,10 @@ struct kyoskNewControls : Controls {
     Caption helpClose{*this, u"helpClose"};
     Caption emptyHead{*this, u"emptyHead"}; // while no folder is picked
     Caption firstFolder{*this, u"firstFolder"};
-    Caption cardOffer{*this, u"cardOffer", Caption::At::Hidden}; // the card that is in
-    Caption cardNote{*this, u"cardNote"};                        // what it holds
-    Caption Image4{*this, u"Image4", Caption::At::Hidden};       // with a picture in the large view
+    Caption cardOffer{*this, u"cardOffer", Caption::At::Hidden};   // the card that is in
+    Caption cardNote{*this, u"cardNote"};                          // what it holds
+    Caption cardCopies{*this, u"cardCopies", Caption::At::Hidden}; // how far what was chosen from it is copied
+    Caption Image4{*this, u"Image4", Caption::At::Hidden};         // with a picture in the large view
     Caption Image5{*this, u"Image5"};
     Caption Image6{*this, u"Image6"};
     Caption Image7{*this, u"Image7"};

@@ -16,11 +16,18 @@ using namespace Qt::StringLiterals;
 // An order that comes back finds its pictures where they were made.
 void kyoskNew::openDoor(const HandOver& before) {
     m_choice.setWorked([this](const QString& listed) { return m_door->worked(listed); });
-    if (!m_door->isOpen())
+    m_state.keptFolder = {};
+    const bool keepsCards = m_platform.cards.areWatched();
+    if (!m_door->isOpen() && !keepsCards)
         return;
-    m_door->setFolder(before.back && !before.doorFolder.isEmpty() ? before.doorFolder
-                                                                  : newDoorFolder(m_platform.files));
-    m_door->setKept([this](const QString& path) { return m_choice.inBasket(path) || m_choice.page().contains(path); });
+    m_door->setFolder(before.back && !before.doorFolder.isEmpty() ? before.doorFolder : newDoorFolder(m_platform.files),
+                      keepsCards);
+    m_door->setKept([this](const QString& path) { return m_choice.inBasket(path); },
+                    [this](const QString& path) { return m_choice.page().contains(path); });
+    if (keepsCards) {
+        m_state.keptFolder = m_door->folder();
+        m_copies = std::make_unique<CardCopies>(m_platform.files, m_state.keptFolder);
+    }
     connect(m_door.get(), &PictureDoor::settled, this, &kyoskNew::pictureSettled);
     connect(m_door.get(), &PictureDoor::drafted, this, &kyoskNew::showDraft);
 }
@@ -44,7 +51,7 @@ QString kyoskNew::unreadableText(const QString& path) const {
 
 // The page in view first, then the next one, then the rest of what is chosen.
 void kyoskNew::orderPictures(const QStringList& next) {
-    if (!m_door->isOpen())
+    if (m_door->folder().isEmpty())
         return;
     QStringList wanted;
     if (!m_openWhenMade.isEmpty())
@@ -67,7 +74,8 @@ QStringList kyoskNew::nextPictures() const {
 void kyoskNew::pictureSettled(const QString& path) {
     if (m_handedOver)
         return;
-    if (m_wait.tellsAtOnce(path))
+    const bool pulled = m_copies && m_copies->stateOf(path) == CardCopies::State::Missing;
+    if (!pulled && m_wait.tellsAtOnce(path))
         m_platform.dialogs.message(m_wait.notMadeWords(path));
     takeOutUnreadable(path);
     const QStringList chosen = m_choice.basket().paths();
@@ -118,25 +126,30 @@ bool kyoskNew::tellTakenOut() {
     return !words.isEmpty();
 }
 
-// Goes on once the last chosen picture is made; what a full disk did not take is tried once more.
+// Goes on once the last chosen picture is made, and copied where it lies on a card; what a full disk did not take is
+// tried once more.
 void kyoskNew::onceMade(void (kyoskNew::*goOn)()) {
     m_openWhenMade.clear();
     m_onceMade = goOn;
     orderPictures();
+    copyChosen(true);
     showWaiting();
 }
 
 void kyoskNew::showWaiting() {
-    const DoorWait::Then then = m_wait.count(m_choice.basket().paths());
+    const DoorWait::Then then =
+        m_wait.count(m_choice.basket().paths(), [this](const QString& path) { return isCopied(path); });
     doorPanel.visible = m_wait.waits();
     doorShare = m_wait.share();
     doorCount.text = m_wait.counted();
-    if (then == DoorWait::Then::GoOn)
-        (this->*m_onceMade)();
-    else if (then == DoorWait::Then::TellNotMade)
-        m_platform.dialogs.message(m_wait.notMadeWords());
-    else
+    if (then == DoorWait::Then::Wait)
         Q_EMIT changed();
+    else if (!chosenOnCards(CardCopies::State::Missing).isEmpty())
+        askForMissing();
+    else if (then == DoorWait::Then::GoOn)
+        (this->*m_onceMade)();
+    else
+        m_platform.dialogs.message(m_wait.notMadeWords());
 }
 
 void kyoskNew::stopWaiting() {

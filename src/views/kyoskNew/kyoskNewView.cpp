@@ -161,7 +161,9 @@ QWidget* kyoskNewView::makeSide() {
     }
     QPushButton* branch = button(c.Image33, Role::Plain, &kyoskNew::Image33_Click, u"shop"_s);
     m_cardPlaces[1] = inRow(Space::None);
-    return inBox(inColumn(Space::Small, {m_cardPlaces[1], {picture.frame, 1}, offer.frame, branch}));
+    return inBox(
+        inColumn(Space::Small,
+                 {m_cardPlaces[1], centred(label(c.cardCopies, "strong")), {picture.frame, 1}, offer.frame, branch}));
 }
 
 void kyoskNewView::makeBars() {

@@ -1,0 +1,115 @@
+#include "selection/CardCopies.h"
+
+#include "common/HostFile.h"
+
+#include <algorithm>
+#include <mutex>
+#include <thread>
+
+namespace lumora {
+
+namespace {
+
+constexpr qint64 atOnce = qint64(4) << 20;
+// What must stay free for the prints of the order.
+constexpr std::uintmax_t spared = std::uintmax_t(256) << 20;
+
+bool hasRoom(const HostPath& target, std::uintmax_t bytes) {
+    std::error_code untold;
+    const std::filesystem::space_info disk = std::filesystem::space(target.parent_path(), untold);
+    return untold || disk.available > bytes + spared;
+}
+
+} // namespace
+
+struct CardCopies::Desk {
+    std::mutex mutex;
+    CardCopies* copies;
+};
+
+CardCopies::CardCopies(const Files& files, const DrivePath& orderFolder)
+    : m_kept(files, orderFolder)
+    , m_desk(std::make_shared<Desk>()) {
+    m_desk->copies = this;
+}
+
+CardCopies::~CardCopies() {
+    m_stop.request_stop();
+    const std::lock_guard lock(m_desk->mutex);
+    m_desk->copies = nullptr;
+}
+
+void CardCopies::want(const std::vector<Picture>& chosen, bool again) {
+    m_queue.clear();
+    for (const Picture& picture : chosen) {
+        Copy& copy = m_copies[picture.path];
+        if (copy.state == State::Unknown && m_kept.has(DrivePath(picture.path)))
+            copy.state = State::Kept; // an order that came back
+        const bool failed = copy.state == State::Missing || copy.state == State::NotKept;
+        if (copy.inHand || copy.state == State::Kept || (failed && !again))
+            continue;
+        copy.state = State::Waiting;
+        m_queue.push_back(picture);
+    }
+    startNext();
+}
+
+// A thread of its own, since a card that hangs may hold it for good.
+void CardCopies::startNext() {
+    if (m_running || m_queue.empty())
+        return;
+    const Picture picture = m_queue.front();
+    m_queue.pop_front();
+    m_running = m_copies[picture.path].inHand = true;
+    const Result<HostPath> target = m_kept.targetOf(DrivePath(picture.path));
+    std::thread([desk = m_desk, picture, target, stop = m_stop.get_token()] {
+        const Copy copy = target ? copyWhole(picture, *target, stop) : Copy{State::NotKept, target.failure(), false};
+        const std::lock_guard lock(desk->mutex);
+        CardCopies* copies = desk->copies;
+        if (copies)
+            QMetaObject::invokeMethod(
+                copies, [copies, path = picture.path, copy] { copies->settle(path, copy); }, Qt::QueuedConnection);
+    }).detach();
+}
+
+void CardCopies::settle(const QString& path, const Copy& copy) {
+    m_running = false;
+    m_copies[path] = copy;
+    startNext();
+    Q_EMIT settled(path);
+}
+
+// What was read counts only where the same file lies there before and after.
+CardCopies::Copy CardCopies::copyWhole(const Picture& picture, const HostPath& target, const std::stop_token& stop) {
+    const auto missing = [&](const Failure& why) { return Copy{State::Missing, why, false}; };
+    const QString shown = shownPath(picture.source.file);
+    const Failure other{Failure::Kind::NotFound, shown};
+    if (!picture.source.stamp.isThere || stampOf(picture.source.file) != picture.source.stamp)
+        return missing(other);
+    if (!hasRoom(target, picture.source.stamp.length))
+        return {State::NotKept, {Failure::Kind::NoSpace, shownPath(target)}, false};
+    const Result<Descriptor> source = openSource(picture.source.file, shown);
+    if (!source)
+        return missing(source.failure());
+    NewContent content(target, shownPath(target));
+    std::uintmax_t copied = 0;
+    for (;;) {
+        const Result<qint64> part = appendFrom(*source, atOnce, content, shown);
+        if (!part)
+            return missing(part.failure());
+        copied += static_cast<std::uintmax_t>(*part);
+        if (stop.stop_requested())
+            return missing(other);
+        if (*part < atOnce)
+            break;
+    }
+    if (!content.failed() &&
+        (copied != picture.source.stamp.length || stampOf(picture.source.file) != picture.source.stamp))
+        return missing(other);
+    content.setTime(picture.source.stamp.time);
+    if (const Result<void> whole = content.commit(); !whole)
+        return {State::NotKept, whole.failure(), false};
+    return {State::Kept, {}, false};
+}
+
+} // namespace lumora
