@@ -12,6 +12,7 @@
 #include <QDateTime>
 #include <QFile>
 #include <QListWidget>
+#include <QRegularExpression>
 #include <QTest>
 
 namespace lumora {
@@ -52,6 +53,10 @@ TEST_P(CardsLook, OffersACardThatIsPutInAndOpensItsNewestFolder) {
     EXPECT_TRUE(shown.List4.item(0).contains(u"\\EOS.card\\DCIM\\101CANON\\")) << qPrintable(shown.List4.item(0));
     EXPECT_FALSE(shown.cardOffer.enabled) << "it is open";
     look(walk, u"12-card-opened"_s);
+    walk.page<kyoskNew>(PageId::kyoskNew).Command12_Click(0);
+    ASSERT_TRUE(
+        QTest::qWaitFor([&] { return shown.cardCopies.visible && !shown.cardCopies.text.contains(u'1'); }, 20000));
+    look(walk, u"12-card-copied"_s);
     media.putIn(walk, "HOLIDAY.card");
     ASSERT_TRUE(QTest::qWaitFor([&] { return shown.cardOffer.enabled; }, 20000));
     look(walk, u"12-card-beside"_s);
@@ -87,12 +92,15 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
         EXPECT_TRUE(file.open(QIODevice::WriteOnly) &&
                     file.setFileTime(now.addSecs(-3600 * hoursAgo), QFileDevice::FileModificationTime));
     }
-    machine.drives.refreshMedia();
     const auto isMounted = [](const HostPath&) { return true; };
     Cards cards([&] { return std::make_unique<MediaFolders>(std::vector{media}, isMounted); }, true);
+    cards.setLook([&, roots = machine.drives.mediaRoots()]() -> std::function<void()> {
+        return [&, found = Drives::findMedia(roots)] { machine.drives.giveLetters(found); };
+    });
     const Cards::Watch watch(cards);
     ASSERT_TRUE(QTest::qWaitFor([&] { return !cards.all().empty() && cards.all()[0].summary; }, 20000));
     EXPECT_EQ(cards.all()[0].summary->pictures, 5) << "of every format";
+    EXPECT_EQ(machine.drives.toDrive(media / "EOS"), u"D:\\"_path) << "known before its count";
     const Theme theme(1);
     QWidget window;
     const PicturePicker picker(theme, &window, state, machine.files, cards, machine.clock, u"x"_s, {}, {},
@@ -105,6 +113,16 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
               u"Today · Saturday, 21 November 2026|c.HEIC|Yesterday · Friday, 20 November 2026|a.jpg|b.jpg|"
               "Thursday, 19 November 2026|old.jpg");
     EXPECT_EQ(grid->currentRow(), 1);
+    for (const char* name : {"LATER", "LAST"})
+        std::filesystem::create_directories(media / name);
+    const auto* third = picker.findChild<QAbstractButton*>(u"card(2)"_s);
+    const auto places = [&] {
+        QStringList folders;
+        for (const auto* place : picker.findChildren<QAbstractButton*>(QRegularExpression(u"^place"_s)))
+            folders += place->toolTip();
+        return folders.filter(toText(media));
+    };
+    EXPECT_TRUE(QTest::qWaitFor([&] { return places().size() == 3 && !third->isHidden(); }, 20000));
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, CardsLook, PageLook::screens(), PageLook::nameOf);

@@ -186,26 +186,41 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
 }
 
 QLayout* PicturePicker::makePlaces() {
-    QVBoxLayout* side = inColumn(
+    m_side = inColumn(
         Space::Small,
         {words("smallMuted", everyFile() ? m_state.wording(u"היכן הקבצים?"_s, u"Where are the files?"_s)
                                          : m_state.wording(u"היכן התמונות?"_s, u"Where are the pictures?"_s))});
-    for (std::size_t i = 0; i < m_places.size(); ++i) {
-        const Place& place = m_places[i];
-        QPushButton* button =
-            wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(startOf(m_places[i].folder)); });
-        setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
-        const int room = m_theme.size(Extent::Field);
-        button->setText(QChar(0xA0) +
-                        button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, room).replace(u'&', u"&&"_s));
-        button->setToolTip(toText(place.folder));
-        button->setCheckable(true);
-        button->setFixedWidth(m_theme.size(Extent::WideField));
-        m_placeButtons.push_back(button);
-        side->addWidget(button);
+    m_side->addStretch(1);
+    for (std::size_t i = 0; i < m_places.size(); ++i)
+        addPlaceButton(i);
+    return m_side;
+}
+
+void PicturePicker::addPlaceButton(std::size_t i) {
+    const Place& place = m_places[i];
+    QPushButton* button =
+        wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(startOf(m_places[i].folder)); });
+    setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
+    const int room = m_theme.size(Extent::Field);
+    button->setText(QChar(0xA0) +
+                    button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, room).replace(u'&', u"&&"_s));
+    button->setToolTip(toText(place.folder));
+    button->setCheckable(true);
+    button->setFixedWidth(m_theme.size(Extent::WideField));
+    m_placeButtons.push_back(button);
+    m_side->insertWidget(m_side->count() - 1, button); // above the stretch
+}
+
+// A card that came later is added below the others, so that no place moves below a finger.
+void PicturePicker::joinPlaces(const std::vector<Cards::Card>& cards) {
+    for (const Cards::Card& card : cards) {
+        const HostPath& folder = card.medium.folder;
+        const auto isIt = [&](const Place& place) { return place.folder == folder; };
+        if (!card.summary || std::any_of(m_places.begin(), m_places.end(), isIt))
+            continue;
+        m_places.push_back({toText(folder.filename()), u"card"_s, folder});
+        addPlaceButton(m_places.size() - 1);
     }
-    side->addStretch(1);
-    return side;
 }
 
 QPushButton* PicturePicker::wordButton(const QString& name, const char* role, const QString& text,
@@ -269,7 +284,8 @@ QLayout* PicturePicker::makeCardRow() {
     for (std::size_t i = 0; i < m_cardSlots.size(); ++i) {
         auto* tile = new CardOffer(m_theme, this, CardOffer::Size::Large);
         tile->setObjectName(u"card(%1)"_s.arg(i));
-        keepPlaceWhenHidden(*tile);
+        if (i < 2) // a third is rare, and takes its room when it comes
+            keepPlaceWhenHidden(*tile);
         connect(tile, &QAbstractButton::clicked, this, [this, i] { openCard(i); });
         m_cardSlots[i].tile = tile;
         row->addWidget(tile, 1);
@@ -300,12 +316,15 @@ void PicturePicker::showCards() {
         if (empty != m_cardSlots.end())
             empty->medium = card.medium.id;
     }
+    const auto isUsed = [](const CardSlot& slot) { return !slot.medium.isEmpty(); };
+    const bool many = std::count_if(m_cardSlots.begin(), m_cardSlots.end(), isUsed) > 2;
     for (CardSlot& slot : m_cardSlots) {
         const auto card = find(slot.medium);
         const bool in = card != cards.end();
         const CardWords words =
             in ? cardWords(*card, m_clock.now().date(), m_state.english()) : noCardWords(m_state.english());
         slot.picture = words.opens ? card->summary->newestPicture : HostPath();
+        slot.tile->setSize(many ? CardOffer::Size::Slim : CardOffer::Size::Large);
         slot.tile->setVisible(in || &slot == &m_cardSlots.front());
         slot.tile->setEnabled(words.opens);
         slot.tile->setText(words.head);
@@ -313,6 +332,8 @@ void PicturePicker::showCards() {
         slot.tile->setToolTip(in ? card->medium.label : QString());
         slot.tile->setAccessibleName(words.note.isEmpty() ? words.head : words.head + u", "_s + words.note);
     }
+    if (m_side)
+        joinPlaces(cards);
 }
 
 void PicturePicker::openCard(std::size_t slot) {

@@ -57,6 +57,8 @@ private:
     void addPicture(const HostPath& path, bool isFolder);
     void addByDays(const std::vector<HostPath>& files);
     QLayout* makePlaces();
+    void addPlaceButton(std::size_t place);
+    void joinPlaces(const std::vector<Cards::Card>& cards);
     void makeGrid();
     QPushButton* wordButton(const QString& name, const char* role, const QString& text,
                             std::function<void()> clicked) const;
@@ -79,10 +81,11 @@ private:
         QString medium;
         HostPath picture; // the newest, empty when none can be opened
     };
-    std::array<CardSlot, 2> m_cardSlots;
+    std::array<CardSlot, 3> m_cardSlots;
     std::optional<Cards::Watch> m_watch;
     std::vector<Place> m_places;
     std::vector<QPushButton*> m_placeButtons;
+    QVBoxLayout* m_side = nullptr;
     HostPath m_folder;
     ElidedLabel* m_where;
     QLabel* m_empty;
