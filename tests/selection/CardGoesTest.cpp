@@ -134,6 +134,7 @@ TEST_P(PulledAt, LosesNothingThatWasSafeAndNamesWhatItLoses) {
         page.Image7_Click();
     }
     if (at == At::Listed) {
+        waitUntil([this] { return !machine.dialogs.messages.isEmpty(); });
         EXPECT_EQ(machine.dialogs.messages, QStringList(u"No pictures were chosen"_s));
         return;
     }
@@ -179,7 +180,7 @@ TEST_F(PulledCards, AreToldApartAtOnePath) {
     pull();
     put("1.jpg", Qt::green);
     pick(page, machine.drives.toDrive(card / "1.jpg").text());
-    EXPECT_EQ(page.controls().Label4[0].text, QString()) << "the other card's is not chosen";
+    EXPECT_EQ(page.controls().Label4[0].text, u"0"_s) << "the other card's is not chosen";
     page.Command12_Click(0);
     finish(page);
     handOver(page);
@@ -201,7 +202,10 @@ TEST_F(PulledCards, GoOnOncePutInAgainOrWhereTheDiskTakesNoCopy) {
     EXPECT_TRUE(machine.files.removeTree(state.keptFolder));
     write(state.keptFolder, "in the way");
     pick(page, machine.drives.toDrive(card / "2.jpg").text());
-    page.Command12_Click(1);
+    int cell = 0;
+    while (cell < 11 && page.controls().Picture1[static_cast<std::size_t>(cell)].name != u"2.jpg"_s)
+        ++cell;
+    page.Command12_Click(cell);
     waitFor(page, u"Please leave the card in"_s);
     EXPECT_EQ(machine.dialogs.messages.size(), 1);
     finish(page);

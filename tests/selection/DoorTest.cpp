@@ -166,7 +166,7 @@ TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
 
 TEST_F(TheDoor, MakesRoomByWhatIsNotKept) {
     PictureDoor door(machine.files, DoorDecoder(LUMORA_DOOR), state.door);
-    door.setFolder(DrivePath(doorFolders) / u"1");
+    door.setFolder(DrivePath(doorFolders) / u"1", false);
     const QStringList made{door.worked(u"C:\\p\\b.jpg"_s), door.worked(u"C:\\p\\café.jpg"_s),
                            door.worked(u"C:\\p\\d.heic"_s)};
     door.setKept([&](const QString& path) { return path == made[0]; }, {}, 1);

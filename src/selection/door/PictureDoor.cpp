@@ -285,7 +285,7 @@ void PictureDoor::start(Picture& picture) {
 
 void PictureDoor::startDraft(const Picture& picture) {
     ++m_running;
-    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = picture.source,
+    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = fileToRead(picture),
                       stop = m_stop.get_token()] {
         const Result<QByteArray> draft = decoder.draft(source, stop);
         const std::lock_guard lock(desk->mutex);
