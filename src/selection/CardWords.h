@@ -27,6 +27,8 @@ struct CopyCount {
 QString copyWords(const CopyCount& count, bool english);
 // Where no card is in.
 CardWords noCardWords(bool english);
+// All that is in is on the page.
+CardWords openedCardWords(bool english);
 // A day as customers say it.
 QString dayWords(QDate day, QDate today, bool english);
 

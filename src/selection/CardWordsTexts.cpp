@@ -79,6 +79,10 @@ CardWords noCardWords(bool english) {
             false};
 }
 
+CardWords openedCardWords(bool english) {
+    return {english ? u"The card is open"_s : u"הכרטיס פתוח"_s, {}, false};
+}
+
 QString dayWords(QDate day, QDate today, bool english) {
     const QLocale language(english ? QLocale::English : QLocale::Hebrew);
     const QString date =

@@ -39,8 +39,11 @@ void kyoskNew::showCards() {
             if (!m_state.door.any())
                 picture = DrivePath(AnsiCodePage::squeeze(picture.text()));
         }
-        if (!picture.isEmpty() && m_choice.folders().paths().contains(picture.text()))
+        if (!picture.isEmpty() && m_choice.folders().paths().contains(picture.text())) {
+            if (m_cardPicture.isEmpty())
+                words = openedCardWords(m_state.english());
             continue;
+        }
         words = cardWords(card, m_platform.clock.now().date(), m_state.english());
         m_cardPicture = picture;
     }
