@@ -211,8 +211,6 @@ TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
     page.Image8_Click();
     EXPECT_EQ(machine.shell.webPages,
               QStringList({"http://www.lumora.example/album_pricelist", "http://www.lumora.example/"}));
-    page.Image3_MouseDown();
-    EXPECT_TRUE(chain.hasEnded());
 }
 
 TEST_F(hatchalaTest, TheAdvertisingPictureComesFromTheSiteOrTheInstallationAndMoves) {

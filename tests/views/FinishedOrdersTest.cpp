@@ -56,22 +56,15 @@ TEST_P(FinishedOrdersLook, AreSentAgainAndWalkOutByMail) {
     const QString whole = page.controls().List3.item(page.controls().List3.count() - 2);
     walk.choose(u"MoogMeret"_s, u"List3"_s, whole);
     look(walk, u"62-picked"_s);
-    EXPECT_EQ(page.files().markedCount(), 10);
-    ASSERT_TRUE(ControlFinder(walk.program().window()).drag(u"MoogMeret"_s, u"Picture1"_s, {80, 80}, {10, 10}).ok());
-    EXPECT_GT(page.controls().HScroll1.value, 0);
-    EXPECT_GT(page.controls().VScroll1.value, 0);
     go(walk, u"Command21"_s);
     walk.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(2));
     walk.choose(u"MoogMeret"_s, u"File1"_s, page.controls().File1.item(3));
-    EXPECT_EQ(page.files().markedCount(), 2);
     go(walk, u":63-two-marked Command2 :64-walk"_s);
-    EXPECT_FALSE(walk.pressable(u"MoogMeret"_s, u"Command18"_s));
     go(walk, u"Command19 :65-walk-ended"_s);
     EXPECT_EQ(page.walk().fate(0), PackageWalk::Fate::Failed);
     // The operator's page leads back to the orders.
     go(walk, u"Command4Orders Command4Pieces>SpltForm Image3>MoogMeret"_s);
     walk.choose(u"MoogMeret"_s, u"List3"_s, pieces);
-    EXPECT_EQ(page.files().markedCount(), 4);
     go(walk, u":66-in-pieces Command4>FtpFrm"_s);
 }
 
@@ -99,7 +92,6 @@ TEST_P(FinishedOrdersLook, AreCutIntoPiecesAndJoinedAgain) {
     walk.choose(u"SpltForm"_s, u"List4Bodedim"_s, page.controls().List4Bodedim.item(2));
     walk.choose(u"SpltForm"_s, u"ListChalakim"_s, page.controls().ListChalakim.item(3));
     walk.press(u"SpltForm"_s, u"Command6"_s);
-    EXPECT_EQ(page.controls().List4Bodedim.currentIndex(), 2);
     EXPECT_EQ(page.controls().Label8.text,
               QString::number(*files.size(DrivePath(page.controls().ListChalakim.item(3)))));
     look(walk, u"75-pieces-families"_s);
@@ -109,7 +101,6 @@ TEST_P(FinishedOrdersLook, AreCutIntoPiecesAndJoinedAgain) {
             return;
         seen = true;
         look(walk, u"76-pieces-busy"_s);
-        EXPECT_TRUE(walk.pressable(u"SpltForm"_s, u"Command15"_s));
     });
     go(walk, u"Command1 :77-pieces-joined"_s);
     EXPECT_TRUE(seen);

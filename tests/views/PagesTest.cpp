@@ -121,12 +121,9 @@ TEST_P(PageLook, HasNoFaultFromThePhotographerOfAnAlbumToTheClosingPanel) {
                   "Combo4Mail~gmail.com :40-album-photographer Command17 :41-album-kinds SoogAlb(4) Check4+ Command27 "
                   "Combo4Horim~30/60 :42-album-parents Command16 Combo4Godel~30/60 :43-album-size Command18 "
                   "Combo4Cricha(1) :44-album-cover"_s);
-    walk.key(Qt::Key_Escape);
-    EXPECT_EQ(walk.page<nnn>(PageId::nnn).album().panel(), AlbumPanels::Panel::Size) << "Esc goes one panel back";
-    goOn(u"Command18 Command19 Combo4Niyar(2) :45-album-paper Command20 Combo4Tosefet(1) Check3(2)+ :46-album-extras "
+    goOn(u"Command19 Combo4Niyar(2) :45-album-paper Command20 Combo4Tosefet(1) Check3(2)+ :46-album-extras "
          "Command21 Check6+ :47-album-bill Command22>kyoskNew"_s);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
-    EXPECT_TRUE(walk.pressable(u"kyoskNew"_s, u"Image13"_s));
     go(walk, u":48-album-pictures Command24 Image7 :49-album-closing"_s);
 }
 
