@@ -3,22 +3,14 @@
 #include "imaging/files/PictureFile.h"
 #include "support/PageRig.h"
 
+#include <QPainter>
+
 #include <gtest/gtest.h>
 
 #include <tuple>
 
 namespace lumora {
 namespace {
-
-// Left half and right half.
-Bitmap halves(int width, int height, QColor left, QColor right) {
-    Bitmap picture(width, height, left);
-    for (int y = 0; y < height; ++y) {
-        for (int x = width / 2; x < width; ++x)
-            picture.image().setPixelColor(x, y, right);
-    }
-    return picture;
-}
 
 TEST(SampleColorLevels, SortsItsValuesAsTextsSoThatTheBrightestComeLast) {
     Bitmap row(11, 1, Qt::black);
@@ -38,15 +30,13 @@ TEST(SampleColorLevels, SortsItsValuesAsTextsSoThatTheBrightestComeLast) {
     }
 }
 
-class WorkSurfaces : public ::testing::Test, protected PageRig {
-protected:
-    WorkSurfaces() { EXPECT_TRUE(picture.image().save(toText(host(path)), "BMP")); }
-
-    const DrivePath path = u"C:\\wide.bmp"_path;
-    const Bitmap picture = halves(1000, 500, QColor(20, 40, 60), QColor(220, 180, 140));
-};
+class WorkSurfaces : public ::testing::Test, protected PageRig {};
 
 TEST_F(WorkSurfaces, APictureToLookAtTurnsByQuartersAndIsReadAgain) {
+    const DrivePath path = u"C:\\wide.bmp"_path;
+    Bitmap picture(1000, 500, QColor(20, 40, 60));
+    QPainter(&picture.image()).fillRect(500, 0, 500, 500, QColor(220, 180, 140));
+    ASSERT_TRUE(picture.image().save(toText(host(path)), "BMP"));
     registerPage<Form3>(PageId::Form3);
     auto& look = chain.load<Form3>();
     look.open(path);

@@ -42,6 +42,10 @@ protected:
         EXPECT_TRUE(WriteOrderState(test.files, folder, state));
         return folder;
     }
+    void giveLog(const OrderFolder& folder, const QStringList& items, const QStringList& failed) {
+        const OrderLog log = OrderLog::of(session, OrderLog::Layout::Plain, items, failed, QDateTime());
+        EXPECT_TRUE(test.files.writeWhole(folder.logPath(), log.write()));
+    }
     OrderState inPhase(Phase phase, const QString& number = u"105"_s) const {
         OrderState state;
         state.phase = phase;
@@ -71,35 +75,25 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     give(u"2026_11_21_KUP_1234^101"_s); // claimed, and then killed
     give(u"not an order"_s);
     give(u"2026_11_21_KUP_1234^102"_s, {".log-there", "1 1015GNB0000_0161.jpp"});
-    OrderState again = inPhase(Phase::Prepared, u"104"_s);
-    again.replaces = u"2026_11_21_KUP_1234^103"_s;
-    give(again.replaces, inPhase(Phase::Prepared, u"103"_s), {print});
-    const OrderFolder anew = give(u"2026_11_21_KUP_1234^104"_s, again, {print});
-    ASSERT_TRUE(test.files.writeWhole(
-        anew.logPath(), OrderLog::of(session, OrderLog::Layout::Plain, again.items, {}, QDateTime()).write()));
+    const QString lacking = u"2026_11_21_KUP_1234^107"_s, late = u"2026_11_20_KUP_1234^109"_s;
+    const auto replace = [&](const QString& replaced, Phase phase, const QString& by, Phase phaseOfBy) {
+        give(replaced, inPhase(phase, replaced.last(3)), {print});
+        OrderState state = inPhase(phaseOfBy, by.last(3));
+        state.replaces = replaced;
+        return give(by, state, phaseOfBy == Phase::Prepared ? QStringList(print) : QStringList());
+    };
+    using enum OrderState::Phase;
+    const OrderFolder anew = replace(u"2026_11_21_KUP_1234^103"_s, Prepared, u"2026_11_21_KUP_1234^104"_s, Prepared);
+    giveLog(anew, inPhase(Prepared).items, {});
     // A picture failed: the replaced order holds its only print.
-    OrderState lacking = inPhase(Phase::Prepared, u"108"_s);
-    lacking.replaces = u"2026_11_21_KUP_1234^107"_s;
-    give(lacking.replaces, inPhase(Phase::Prepared, u"107"_s), {print});
-    const OrderFolder lacks = give(u"2026_11_21_KUP_1234^108"_s, lacking, {print});
-    ASSERT_TRUE(test.files.writeWhole(
-        lacks.logPath(),
-        OrderLog::of(session, OrderLog::Layout::Plain, again.items, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
-    // 109 was sent after all.
-    OrderState late = inPhase(Phase::Prepared, u"110"_s);
-    late.replaces = u"2026_11_20_KUP_1234^109"_s;
-    give(late.replaces, inPhase(Phase::Sending, u"109"_s), {print});
-    give(u"2026_11_20_KUP_1234^110"_s, late, {print});
-    // Not whole yet: the replaced order keeps its prints.
-    OrderState underWay = inPhase(Phase::Preparing, u"106"_s);
-    underWay.replaces = name;
-    give(name, inPhase(Phase::Prepared), {print});
-    give(u"2026_11_21_KUP_1234^106"_s, underWay);
+    giveLog(replace(lacking, Prepared, u"2026_11_21_KUP_1234^108"_s, Prepared), inPhase(Prepared).items,
+            {u"C:\\pics\\gone.jpg"_s});
+    replace(late, Sending, u"2026_11_20_KUP_1234^110"_s, Prepared);   // it was sent after all
+    replace(name, Prepared, u"2026_11_21_KUP_1234^106"_s, Preparing); // not whole yet: the prints are kept
     TidyOrders(session, test.files);
-    EXPECT_EQ(
-        test.files.folders(orders),
-        QStringList({late.replaces, "2026_11_20_KUP_1234^110", "2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104",
-                     name, "2026_11_21_KUP_1234^106", lacking.replaces, "2026_11_21_KUP_1234^108", "not an order"}));
+    EXPECT_EQ(test.files.folders(orders),
+              QStringList({late, "2026_11_20_KUP_1234^110", "2026_11_21_KUP_1234^102", "2026_11_21_KUP_1234^104", name,
+                           "2026_11_21_KUP_1234^106", lacking, "2026_11_21_KUP_1234^108", "not an order"}));
     EXPECT_FALSE(test.files.fileExists(orders / u"2026_11_21_KUP_1234^102" / u".log-there"));
     EXPECT_EQ(take(ReadOrderState(test.files, anew)).replaces, QString()) << "its number may come again";
     EXPECT_EQ(ReplacementOf(session, test.files, OrderFolder(orders / name))->name(), u"2026_11_21_KUP_1234^106");
@@ -107,7 +101,7 @@ TEST_F(OrdersOfAKiosk, AreTidiedOfWhatAKillHasLeft) {
     EXPECT_FALSE(ReplacementOf(session, test.files, OrderFolder(orders / name))) << "it was sent after all";
     give(name, inPhase(Phase::Prepared));
     EXPECT_EQ(offered(), QStringList({"2026_11_21_KUP_1234^108", "2026_11_21_KUP_1234^106", "2026_11_21_KUP_1234^104",
-                                      "2026_11_20_KUP_1234^110", late.replaces}))
+                                      "2026_11_20_KUP_1234^110", late}))
         << "the replaced one waits";
 }
 
@@ -166,9 +160,7 @@ TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
     give(u"2026_11_21_KUP_1234^103"_s, givenUp, {print});
     give(u"2026_11_21_KUP_1234^102"_s, inPhase(Phase::Sending), {print});
     const OrderFolder lacking = give(u"2026_11_21_KUP_1234^101"_s, inPhase(Phase::Prepared), {print});
-    ASSERT_TRUE(test.files.writeWhole(
-        lacking.logPath(),
-        OrderLog::of(session, OrderLog::Layout::Plain, {}, {u"C:\\pics\\gone.jpg"_s}, QDateTime()).write()));
+    giveLog(lacking, {}, {u"C:\\pics\\gone.jpg"_s});
     const auto waiting = [this](bool on, bool careful) {
         session.Waiting = on;
         session.Careful = careful;
@@ -232,9 +224,7 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
         OrderState state = inPhase(way == Way::Http ? Phase::Sending : Phase::Prepared);
         state.way = way;
         const OrderFolder folder = give(name + u'P', state);
-        const QStringList failed = {u"C:\\pics\\caf?.jpg"_s, u"C:\\pics\\gone.jpg"_s};
-        ASSERT_TRUE(test.files.writeWhole(
-            folder.logPath(), OrderLog::of(session, OrderLog::Layout::Plain, {}, failed, QDateTime()).write()));
+        giveLog(folder, {}, {u"C:\\pics\\caf?.jpg"_s, u"C:\\pics\\gone.jpg"_s});
         SessionState sending;
         sending.transfer.SugMishloah = Sending::Resend;
         sending.transfer.leftOut = {{u"C:\\of another order.jpg"_path}};

@@ -6,7 +6,7 @@
 #include "platform/files/MarkedVolume.h"
 #include "platform/files/StatVolume.h"
 #include "platform/line/LineAbort.h"
-#include "support/DrivePathLiteral.h"
+#include "support/TestPlatform.h"
 
 #include <Poco/Net/NetException.h>
 #include <Poco/Net/ServerSocket.h>
@@ -64,13 +64,8 @@ TEST(StatVolume, TakesTheSerialThatAMediumWasFormattedWith) {
               serialOfUuid(u"0a1b2c3d-0000-4000-8000-000000000002"_s));
 }
 
-class PlainVolume : public Volume {
-public:
-    Result<std::int32_t> serial(const DrivePath&) const override { return 12345678; }
-};
-
 TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
-    const PlainVolume plain;
+    const FixedVolume plain;
     const QTemporaryDir folder;
     const HostPath data = toHostPath(folder.path());
     const QStringList here = {u"52:54:00:00:00:01"_s, u"52:54:00:00:00:02"_s};
@@ -97,7 +92,7 @@ TEST(MarkedVolume, KeepsTheSerialOfAFolderAndChangesItWithTheMachine) {
     int told = 0;
     const MarkedVolume unkept(plain, "/proc/none", here, [&](const Failure&) { ++told; });
     for (int time = 0; time < 2; ++time)
-        EXPECT_EQ(*unkept.serial(u"C:\\"_path), 12345678) << "a mark that can't be kept";
+        EXPECT_EQ(*unkept.serial(u"C:\\"_path), plain.number) << "a mark that can't be kept";
     EXPECT_EQ(told, 1);
 }
 
