@@ -292,8 +292,8 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     NewContent content(target, shownPath(target));
     if (const auto done = appendFrom(copied ? *file : picture->file, toTheEnd, content, shownPath(source)); !done)
         return ofSource(done.failure());
-    // What is lost by a crash is made again from the customer's file.
-    if (auto written = content.commit(NewContent::Durability::Passing); !written) {
+    // The card may go once this is there.
+    if (auto written = content.commit(); !written) {
         const bool full = written.failure().kind == Failure::Kind::NoSpace;
         return Failure{full ? Failure::Kind::NoSpace : Failure::Kind::Other, written.failure().message};
     }

@@ -33,7 +33,8 @@ QList<UnfinishedOrder> OrdersThatWait(const SessionState& state, const Platform&
     QList<UnfinishedOrder> orders = UnfinishedOrders(state, platform.files);
     orders.removeIf([&](const UnfinishedOrder& order) {
         return order.state.phase == OrderState::Phase::Preparing || order.state.givenUp ||
-               waitsForAnswer(state, platform.files, order);
+               waitsForAnswer(state, platform.files, order) ||
+               !ReadOrderState(platform.files, order.folder); // a person decides about a state that is only guessed
     });
     std::reverse(orders.begin(), orders.end());
     return orders;

@@ -14,6 +14,13 @@ constexpr qint64 atOnce = qint64(4) << 20;
 // What must stay free for the prints of the order.
 constexpr std::uintmax_t spared = std::uintmax_t(256) << 20;
 
+// No fault of the card.
+Failure ofThisDisk(Failure failure) {
+    if (failure.kind != Failure::Kind::NoSpace)
+        failure.kind = Failure::Kind::Other;
+    return failure;
+}
+
 bool hasRoom(const HostPath& target, std::uintmax_t bytes) {
     std::error_code untold;
     const std::filesystem::space_info disk = std::filesystem::space(target.parent_path(), untold);
@@ -43,6 +50,8 @@ void CardCopies::want(const std::vector<Picture>& chosen, bool again) {
     m_queue.clear();
     for (const Picture& picture : chosen) {
         Copy& copy = m_copies[picture.path];
+        if (!copy.inHand && copy.stamp != picture.source.stamp)
+            copy = {State::Unknown, {}, false, picture.source.stamp}; // of another card
         if (copy.state == State::Unknown && m_kept.has(DrivePath(picture.path)))
             copy.state = State::Kept; // an order that came back
         const bool failed = copy.state == State::Missing || copy.state == State::NotKept;
@@ -63,7 +72,8 @@ void CardCopies::startNext() {
     m_running = m_copies[picture.path].inHand = true;
     const Result<HostPath> target = m_kept.targetOf(DrivePath(picture.path));
     std::thread([desk = m_desk, picture, target, stop = m_stop.get_token()] {
-        const Copy copy = target ? copyWhole(picture, *target, stop) : Copy{State::NotKept, target.failure(), false};
+        const Copy copy = target ? copyWhole(picture, *target, stop)
+                                 : Copy{State::NotKept, ofThisDisk(target.failure()), false, picture.source.stamp};
         const std::lock_guard lock(desk->mutex);
         CardCopies* copies = desk->copies;
         if (copies)
@@ -81,13 +91,13 @@ void CardCopies::settle(const QString& path, const Copy& copy) {
 
 // What was read counts only where the same file lies there before and after.
 CardCopies::Copy CardCopies::copyWhole(const Picture& picture, const HostPath& target, const std::stop_token& stop) {
-    const auto missing = [&](const Failure& why) { return Copy{State::Missing, why, false}; };
+    const auto missing = [&](const Failure& why) { return Copy{State::Missing, why, false, picture.source.stamp}; };
     const QString shown = shownPath(picture.source.file);
     const Failure other{Failure::Kind::NotFound, shown};
     if (!picture.source.stamp.isThere || stampOf(picture.source.file) != picture.source.stamp)
         return missing(other);
     if (!hasRoom(target, picture.source.stamp.length))
-        return {State::NotKept, {Failure::Kind::NoSpace, shownPath(target)}, false};
+        return {State::NotKept, {Failure::Kind::NoSpace, shownPath(target)}, false, picture.source.stamp};
     const Result<Descriptor> source = openSource(picture.source.file, shown);
     if (!source)
         return missing(source.failure());
@@ -108,8 +118,8 @@ CardCopies::Copy CardCopies::copyWhole(const Picture& picture, const HostPath& t
         return missing(other);
     content.setTime(picture.source.stamp.time);
     if (const Result<void> whole = content.commit(); !whole)
-        return {State::NotKept, whole.failure(), false};
-    return {State::Kept, {}, false};
+        return {State::NotKept, ofThisDisk(whole.failure()), false, picture.source.stamp};
+    return {State::Kept, {}, false, picture.source.stamp};
 }
 
 } // namespace lumora

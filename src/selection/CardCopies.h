@@ -45,6 +45,7 @@ private:
         State state = State::Unknown;
         Failure failure;
         bool inHand = false;
+        PictureStamp stamp = {}; // of the picture that is meant
     };
     struct Desk; // where a thread hands in its result, also when nobody waits for it any more
 

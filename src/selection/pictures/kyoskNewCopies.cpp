@@ -90,6 +90,7 @@ void kyoskNew::cardsChanged() {
                                       (state == CopyState::NotKept && !isIn(*picture))));
     }
     copyChosen(again);
+    orderPictures();
     showCards();
     Q_EMIT changed();
 }

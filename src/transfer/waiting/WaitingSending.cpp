@@ -59,7 +59,7 @@ SendingPage* WaitingSending::page() const {
 
 // The start page has read the lab's file by now.
 void WaitingSending::cameToFront(const Page& page) {
-    stop();
+    makeWay();
     if (!m_state.Waiting)
         return;
     m_lastPress = m_platform.clock.running();
@@ -87,7 +87,14 @@ bool WaitingSending::eventFilter(QObject* watched, QEvent* event) {
 
 void WaitingSending::pressed() {
     m_lastPress = m_platform.clock.running();
-    stop();
+    makeWay();
+}
+
+// A report that was cut is never made again, and it is short.
+void WaitingSending::makeWay() {
+    const SendingPage* sending = page();
+    if (!sending || sending->phase() != SendingPhase::Reporting)
+        stop();
 }
 
 // No handler and no question is under way, nor a sending that was cut and has not yet come back.
@@ -140,7 +147,8 @@ void WaitingSending::stop() {
     if (!m_inHand)
         return;
     m_inHand.reset();
-    m_pages.unload(m_pages.front()->id());
+    if (const Page* sending = m_pages.front())
+        m_pages.unload(sending->id());
 }
 
 void WaitingSending::tellCount() {

@@ -17,7 +17,7 @@ struct Deployment;
 
 // Sends the orders that wait, one at a time, while nobody is at the start page, where the lab has [Kiosk] Waiting. The
 // pages of sending do it as they always do, in a chain and a session of their own that no window shows, and whose
-// questions are answered with no. A press, or another page in front, cuts the line at once.
+// questions are answered with no. A press, or another page in front, cuts the line at once, but for a report.
 class WaitingSending : public QObject {
     Q_OBJECT
 public:
@@ -52,6 +52,7 @@ private:
     void step();
     void beginNext();
     void endTry(SendingPage& page);
+    void makeWay();
     void stop();
     void tellCount();
     bool isFree() const;
