@@ -59,8 +59,7 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
          [&] {
              const auto made = DoorDecoder({}).make(upright, behindTheDoor);
              return made ? Result<void>() : made.failure();
-         },
-         0},
+         }},
         {root / u"copy", [&] { return files.copyFile(piece, root / u"copy"); }},
         {root / u"b_jpp_003_003.prk",
          [&] {
