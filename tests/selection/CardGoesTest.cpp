@@ -34,6 +34,11 @@ protected:
         registerBare({PageId::FtpFrm});
         makeFolder(u"C:\\vedron"_path);
     }
+    // The page watches the cards, which go before the chain of the rig does.
+    void TearDown() override {
+        chain.unload(PageId::kyoskNew);
+        QGuiApplication::processEvents();
+    }
     template <class P>
     void registerHere(PageId id) {
         chain.registerPage(id, [this] { return std::make_unique<P>(state, platform, chain); });
