@@ -9,9 +9,12 @@
 
 #include <QApplication>
 #include <QKeyEvent>
+#include <QPointingDevice>
 #include <QTest>
 
 #include <gtest/gtest.h>
+
+#include <memory>
 
 namespace lumora {
 
@@ -39,12 +42,13 @@ TEST(DoubledPress, CountsOnceTheHandWasUpForAPauseBehindWhatHasChanged) {
     target.setAutoDefault(true); // Enter
     target.setGeometry(0, 0, 100, 100);
     target.show();
+    const std::unique_ptr<QPointingDevice> finger(QTest::createTouchDevice());
     using Do = std::function<void()>;
     const std::pair<const char*, Do> hands[] = {{"mouse", [&] { QTest::mouseClick(&target, Qt::LeftButton); }},
                                                 {"finger",
-                                                 [&, device = QTest::createTouchDevice()] {
-                                                     QTest::touchEvent(&window, device).press(0, {50, 50});
-                                                     QTest::touchEvent(&window, device).release(0, {50, 50});
+                                                 [&] {
+                                                     QTest::touchEvent(&window, finger.get()).press(0, {50, 50});
+                                                     QTest::touchEvent(&window, finger.get()).release(0, {50, 50});
                                                  }},
                                                 {"Enter", [&] { QTest::keyClick(&target, Qt::Key_Return); }},
                                                 {"blank", [&] { QTest::keyClick(&target, Qt::Key_Space); }}};
