@@ -14,6 +14,7 @@
 
 #include <QGuiApplication>
 #include <QTemporaryDir>
+#include <QTimer>
 
 #include <algorithm>
 #include <cstdio>
@@ -89,8 +90,11 @@ public:
                allDrawn();
     }
     static void waitFor(const std::function<bool()>& done) {
+        // Sleeps between the looks: the call of processEvents that takes a time never does, and took a processor.
+        QTimer looks;
+        looks.start(20);
         while (!done())
-            QGuiApplication::processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents, 20);
+            QGuiApplication::processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents);
     }
 
     // The whole folder as one order, up to its whole folder of prints. Tells how many there are.

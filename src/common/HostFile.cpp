@@ -54,6 +54,12 @@ Failure fileFailure(const std::filesystem::path& path, const QString& what, int 
     return systemFailure(error, u"%1: %2"_s.arg(shownPath(path), what));
 }
 
+Failure targetFailure(Failure failure) {
+    if (failure.kind != Failure::Kind::NoSpace)
+        failure.kind = Failure::Kind::Other;
+    return failure;
+}
+
 Descriptor::Descriptor(Descriptor&& other) noexcept
     : m_number(std::exchange(other.m_number, -1)) {}
 

@@ -18,6 +18,9 @@ QString shownPath(const std::filesystem::path& path);
 Failure systemFailure(int error, const QString& path);
 Failure fileFailure(const std::filesystem::path& path, const QString& what, int error);
 
+// Where a file is made of another one, a failure to write it must not pass for one of the source: full, or other.
+Failure targetFailure(Failure failure);
+
 // A file descriptor that is closed at the end.
 class Descriptor {
 public:

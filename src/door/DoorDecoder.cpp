@@ -293,10 +293,8 @@ Result<DoorDecoder::Made> DoorDecoder::make(const std::filesystem::path& source,
     if (const auto done = appendFrom(copied ? *file : picture->file, toTheEnd, content, shownPath(source)); !done)
         return ofSource(done.failure());
     // The card may go once this is there.
-    if (auto written = content.commit(); !written) {
-        const bool full = written.failure().kind == Failure::Kind::NoSpace;
-        return Failure{full ? Failure::Kind::NoSpace : Failure::Kind::Other, written.failure().message};
-    }
+    if (auto written = content.commit(); !written)
+        return targetFailure(written.failure());
     return Made{picture->profileIgnored};
 }
 

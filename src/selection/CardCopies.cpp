@@ -14,13 +14,6 @@ constexpr qint64 atOnce = qint64(4) << 20;
 // What must stay free for the prints of the order.
 constexpr std::uintmax_t spared = std::uintmax_t(256) << 20;
 
-// No fault of the card.
-Failure ofThisDisk(Failure failure) {
-    if (failure.kind != Failure::Kind::NoSpace)
-        failure.kind = Failure::Kind::Other;
-    return failure;
-}
-
 bool hasRoom(const HostPath& target, std::uintmax_t bytes) {
     std::error_code untold;
     const std::filesystem::space_info disk = std::filesystem::space(target.parent_path(), untold);
@@ -50,9 +43,9 @@ void CardCopies::want(const std::vector<Picture>& chosen, bool again) {
     m_queue.clear();
     for (const Picture& picture : chosen) {
         Copy& copy = m_copies[picture.path];
-        if (!copy.inHand && copy.stamp != picture.source.stamp)
-            copy = {State::Unknown, {}, false, picture.source.stamp}; // of another card
-        if (copy.state == State::Unknown && m_kept.has(DrivePath(picture.path)))
+        if (copy.stamp != picture.source.stamp)
+            copy = {State::Unknown, {}, false, picture.source.stamp}; // of another card, also where that one is in hand
+        if (copy.state == State::Unknown && isKept(picture))
             copy.state = State::Kept; // an order that came back
         const bool failed = copy.state == State::Missing || copy.state == State::NotKept;
         if (copy.inHand || copy.state == State::Kept || (failed && !again))
@@ -61,6 +54,12 @@ void CardCopies::want(const std::vector<Picture>& chosen, bool again) {
         m_queue.push_back(picture);
     }
     startNext();
+}
+
+// A card that has gone can tell of no other picture.
+bool CardCopies::isKept(const Picture& picture) const {
+    const PictureStamp kept = m_kept.copiedStamp(DrivePath(picture.path));
+    return kept.isThere && (!picture.source.stamp.isThere || kept == picture.source.stamp);
 }
 
 // A thread of its own, since a card that hangs may hold it for good.
@@ -73,7 +72,7 @@ void CardCopies::startNext() {
     const Result<HostPath> target = m_kept.targetOf(DrivePath(picture.path));
     std::thread([desk = m_desk, picture, target, stop = m_stop.get_token()] {
         const Copy copy = target ? copyWhole(picture, *target, stop)
-                                 : Copy{State::NotKept, ofThisDisk(target.failure()), false, picture.source.stamp};
+                                 : Copy{State::NotKept, targetFailure(target.failure()), false, picture.source.stamp};
         const std::lock_guard lock(desk->mutex);
         CardCopies* copies = desk->copies;
         if (copies)
@@ -84,7 +83,8 @@ void CardCopies::startNext() {
 
 void CardCopies::settle(const QString& path, const Copy& copy) {
     m_running = false;
-    m_copies[path] = copy;
+    if (m_copies[path].stamp == copy.stamp)
+        m_copies[path] = copy;
     startNext();
     Q_EMIT settled(path);
 }
@@ -94,6 +94,8 @@ CardCopies::Copy CardCopies::copyWhole(const Picture& picture, const HostPath& t
     const auto missing = [&](const Failure& why) { return Copy{State::Missing, why, false, picture.source.stamp}; };
     const QString shown = shownPath(picture.source.file);
     const Failure other{Failure::Kind::NotFound, shown};
+    std::error_code untold;
+    std::filesystem::remove(target, untold); // of another card
     if (!picture.source.stamp.isThere || stampOf(picture.source.file) != picture.source.stamp)
         return missing(other);
     if (!hasRoom(target, picture.source.stamp.length))
@@ -118,7 +120,7 @@ CardCopies::Copy CardCopies::copyWhole(const Picture& picture, const HostPath& t
         return missing(other);
     content.setTime(picture.source.stamp.time);
     if (const Result<void> whole = content.commit(); !whole)
-        return {State::NotKept, ofThisDisk(whole.failure()), false, picture.source.stamp};
+        return {State::NotKept, targetFailure(whole.failure()), false, picture.source.stamp};
     return {State::Kept, {}, false, picture.source.stamp};
 }
 

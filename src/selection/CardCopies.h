@@ -50,6 +50,7 @@ private:
     struct Desk; // where a thread hands in its result, also when nobody waits for it any more
 
     static Copy copyWhole(const Picture& picture, const HostPath& target, const std::stop_token& stop);
+    bool isKept(const Picture& picture) const;
     void startNext();
     void settle(const QString& path, const Copy& copy);
 

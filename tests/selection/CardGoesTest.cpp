@@ -103,13 +103,17 @@ protected:
 };
 
 enum class At { Listed, Copying, HalfCopied, Finish, Copied, Editor, Compression, Preparing, TakenUp };
-using Pull = std::pair<At, const char*>; // and what is lost
+struct Pull {
+    const char* name;
+    At at;
+    const char* lost = "";
+};
 
 class PulledAt : public PulledCards, public testing::WithParamInterface<Pull> {};
 
 TEST_P(PulledAt, LosesNothingThatWasSafeAndNamesWhatItLoses) {
-    const At at = GetParam().first;
-    const QString lost = QString::fromLatin1(GetParam().second);
+    const At at = GetParam().at;
+    const QString lost = QString::fromLatin1(GetParam().lost);
     const bool slow = at == At::Copying || at == At::HalfCopied || at == At::Finish;
     state.Optint = at == At::Editor ? OrderKind::EditedPrint : OrderKind::Print;
     put("1.jpg", Qt::red);
@@ -172,10 +176,13 @@ TEST_P(PulledAt, LosesNothingThatWasSafeAndNamesWhatItLoses) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Steps, PulledAt,
-                         testing::Values(Pull(At::Listed, "1.jpg\n2.jpg"), Pull(At::Copying, "2.jpg"),
-                                         Pull(At::HalfCopied, "2.jpg"), Pull(At::Finish, "2.jpg"), Pull(At::Copied, ""),
-                                         Pull(At::Editor, ""), Pull(At::Compression, ""), Pull(At::Preparing, ""),
-                                         Pull(At::TakenUp, "")));
+                         testing::Values(Pull{"Listed", At::Listed, "1.jpg\n2.jpg"},
+                                         Pull{"Copying", At::Copying, "2.jpg"},
+                                         Pull{"HalfCopied", At::HalfCopied, "2.jpg"},
+                                         Pull{"Finish", At::Finish, "2.jpg"}, Pull{"Copied", At::Copied},
+                                         Pull{"Editor", At::Editor}, Pull{"Compression", At::Compression},
+                                         Pull{"Preparing", At::Preparing}, Pull{"TakenUp", At::TakenUp}),
+                         [](const testing::TestParamInfo<Pull>& step) { return std::string(step.param.name); });
 
 TEST_F(PulledCards, AreToldApartAtOnePath) {
     put("1.jpg", Qt::red);
@@ -191,6 +198,23 @@ TEST_F(PulledCards, AreToldApartAtOnePath) {
     handOver(page);
     prepare();
     EXPECT_EQ(prints(), QList({jpeg(Qt::red), jpeg(Qt::green)}));
+}
+
+// The first card's copy is in hand when the customer has given it up for the second one's.
+TEST_F(PulledCards, LeaveNoCopyToThePictureOfAnotherCard) {
+    put("1.jpg", Qt::red);
+    const QString path = machine.drives.toDrive(card / "1.jpg").text();
+    const PictureSource first{card / "1.jpg", stampOf(card / "1.jpg")};
+    CardCopies copies(machine.files, doorFolders / u"1");
+    const KeptPictures kept(machine.files, doorFolders / u"1");
+    makeFolder(doorFolders);
+    copies.want({{path, first}}, false);
+    pull();
+    put("1.jpg", Qt::green, 100);
+    const PictureSource second{card / "1.jpg", stampOf(card / "1.jpg")};
+    copies.want({{path, second}}, false);
+    waitUntil([&] { return copies.stateOf(path) == CardCopies::State::Kept; });
+    EXPECT_EQ(kept.copiedStamp(DrivePath(path)), second.stamp);
 }
 
 TEST_F(PulledCards, GoOnOncePutInAgainOrWhereTheDiskTakesNoCopy) {

@@ -1,6 +1,7 @@
 #include "selection/door/PictureDoor.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/HostFile.h"
 #include "common/PictureName.h"
 #include "common/Warning.h"
 #include "door/PictureDraft.h"
@@ -310,9 +311,7 @@ void PictureDoor::settleDraft(const QString& worked, const Result<QByteArray>& d
 Result<HostPath> PictureDoor::targetOf(const DrivePath& made) const {
     for (const DrivePath& folder : {m_folder.folder(), m_folder, made.folder()}) {
         if (const Result<void> there = m_files.makeFolder(folder); !there)
-            return Failure{there.failure().kind == Failure::Kind::NoSpace ? Failure::Kind::NoSpace
-                                                                          : Failure::Kind::Other,
-                           there.failure().message};
+            return targetFailure(there.failure());
     }
     return m_files.host(made);
 }
