@@ -11,7 +11,8 @@ using namespace Qt::StringLiterals;
 namespace {
 
 QThreadPool& reader() {
-    static QThreadPool pool;
+    // Never ended: that would wait for a read from a card that hangs.
+    static QThreadPool& pool = *new QThreadPool;
     pool.setMaxThreadCount(1);
     return pool;
 }

@@ -55,7 +55,8 @@ Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, c
 
 // Not the pool in which small pictures are drawn: a damaged file may hold its thread for half a minute.
 QThreadPool& decoders() {
-    static QThreadPool pool;
+    // Never ended: that would wait for a read from a card that hangs.
+    static QThreadPool& pool = *new QThreadPool;
     pool.setMaxThreadCount(madeAtOnce);
     return pool;
 }
