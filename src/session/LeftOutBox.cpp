@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/WayBack.h"
 
 namespace lumora {
 
@@ -31,7 +32,7 @@ bool LeftOutBox::isAwaited() const {
 }
 
 bool LeftOutBox::leadsToPictures() const {
-    return !m_state.handOver.basket.isEmpty() && m_chain.canFollow(m_page, Outcome::PicturesWanted);
+    return lumora::leadsToPictures(m_page, m_state, m_chain);
 }
 
 void LeftOutBox::open(Order order) {
@@ -62,13 +63,7 @@ bool LeftOutBox::goBack() {
         m_chain.follow(m_page, Outcome::NewOrderWanted);
         return false;
     }
-    m_state.handOver.back = true;
-    // The sending page has read the order's details from its log, which the code page may have changed.
-    m_state.shemot = m_state.handOver.details;
-    const bool left = m_chain.follow(m_page, Outcome::PicturesWanted);
-    if (!left)
-        m_state.handOver.back = false;
-    return left;
+    return goBackToPictures(m_page, m_state, m_chain);
 }
 
 } // namespace lumora
