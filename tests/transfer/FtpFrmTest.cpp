@@ -1,11 +1,17 @@
+#include "imaging/files/PictureFile.h"
 #include "order/OrderFolder.h"
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
+#include "order/PrintFile.h"
+#include "platform/media/MediaFolders.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/OrderFiles.h"
 
+#include <QTest>
+
 #include <gtest/gtest.h>
 
+#include <fstream>
 #include <functional>
 
 namespace lumora {
@@ -130,6 +136,88 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         page.Command28_Click();
         EXPECT_EQ(line.rig.chain.front()->id(), PageId::hatchala) << "every end leads to a new order";
         EXPECT_EQ(line.rig.chain.find(PageId::FtpFrm), nullptr);
+    }
+}
+
+TEST_F(FtpFrmTest, ThanksByNameAndSaysWhenTheCardMayGo) {
+    namespace fs = std::filesystem;
+    const QTemporaryDir media;
+    const fs::path card = fs::path(media.path().toStdString()) / "EOS.card";
+    Cards cards([&] {
+        return std::make_unique<MediaFolders>(std::vector{toHostPath(media.path())},
+                                              [](const HostPath& path) { return path.extension() == ".card"; });
+    });
+    TestPlatform& test = rig.test;
+    const Platform platform{test.files,  test.dialogs,   lab,   test.mail, test.shell, test.clock, test.pump,
+                            test.volume, test.instances, cards, {}};
+    const auto wait = [](const auto& done) { return QTest::qWaitFor(done, 30000); };
+    for (const auto sending : {Sending::Resend, Sending::NewOrder}) {
+        fs::create_directories(card);
+        std::ofstream(card / "1.jpg") << "picture";
+        rig.chain.registerPage(PageId::FtpFrm,
+                               [&] { return std::make_unique<FtpFrm>(rig.state, platform, rig.chain); });
+        rig.state.transfer.SugMishloah = sending;
+        rig.start().showPrints();
+        const FtpFrmControls& shown = rig.page().controls();
+        EXPECT_FALSE(shown.thanks.visible || shown.cardMayGo.visible);
+        rig.countDown();
+        EXPECT_TRUE(shown.thanks.visible && shown.nextSteps.visible);
+        EXPECT_EQ(shown.thanks.text, u"תודה, \u2068דנה\u2069!"_s);
+        EXPECT_EQ(shown.shortNumber.text, u"105"_s);
+        const Cards::Watch watch(cards);
+        const auto isCounted = [&] { return !cards.all().empty() && cards.all().front().summary; };
+        EXPECT_TRUE(wait(isCounted) && shown.cardMayGo.visible == (sending == Sending::NewOrder));
+        fs::remove_all(card);
+        EXPECT_TRUE(wait([&] { return !shown.cardMayGo.visible; }));
+        rig.chain.unload(PageId::FtpFrm);
+        QCoreApplication::processEvents();
+        remote().clear();
+    }
+}
+
+TEST_F(FtpFrmTest, ShowsTheFirstPrintsInTheOrderOfTheBasketAndLeavesOutWhatIsNoPicture) {
+    rig.state.profile.JppChunks = 56;
+    const auto print = [&](int index, PictureSize size) {
+        const QByteArray jpeg = take(encodeJpeg(Bitmap(size.width, size.height, Qt::red), 80));
+        rig.write(u"011015GNB%1_03AA.jpp"_s.arg(index, 4, 10, QChar(u'0')),
+                  take(packPrintFile(jpeg, PrintFileShape::of(rig.state.profile), QByteArray(40, ' '))));
+    };
+    for (int i = 9; i > 1; --i)
+        print(i, {i * 100, 100});
+    FtpFrm& page = rig.start();
+    page.showPrints();
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !page.prints().empty(); }, 30000));
+    std::vector<int> heights;
+    for (const Bitmap& made : page.prints()) {
+        EXPECT_EQ(made.width(), 480);
+        heights.push_back(made.height());
+    }
+    EXPECT_EQ(heights, (std::vector{240, 160, 120})) << "of the first five files two are no pictures";
+}
+
+TEST(FtpFrm, LeadsBackToThePicturesUntilTheSendingBegins) {
+    for (const int ticks : {0, 1, 15}) {
+        for (const auto sending : {Sending::NewOrder, Sending::Resend}) {
+            Line line;
+            SessionState& state = line.rig.state;
+            state.handOver.basket = {u"1 1015GNBC:\\a.jpg"_s};
+            state.handOver.details.n1 = u"Иван"_s;
+            if (sending == Sending::Resend)
+                line.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::first()});
+            line.rig.registerBare({PageId::kyoskNew});
+            FtpFrm& page = line.rig.start();
+            for (int i = 0; i < ticks; ++i)
+                page.Timer1_Tick();
+            if (ticks == 1)
+                page.Command23_Click();
+            const bool may = ticks < 15 && sending == Sending::NewOrder;
+            EXPECT_EQ(page.controls().changeOrder.visible, may);
+            page.changeOrder_Click();
+            EXPECT_EQ(line.rig.chain.front()->id(), may ? PageId::kyoskNew : PageId::FtpFrm);
+            EXPECT_EQ(state.handOver.back, may);
+            EXPECT_EQ(line.rig.test.files.folderExists(FtpFrmRig::folder()), !may);
+            EXPECT_EQ(state.shemot.n1 == u"Иван"_s, may) << "not as the log has it";
+        }
     }
 }
 

@@ -1,4 +1,5 @@
 #include "support/ExampleOrder.h"
+#include "transfer/delivery/OrderFacts.h"
 #include "transfer/delivery/OrderSummary.h"
 #include "transfer/delivery/UploadProgress.h"
 
@@ -21,6 +22,46 @@ TEST(OrderSummary, ShowsWhoOnlyForANewOrderAndDeliveryOnlyWhenAskedFor) {
     EXPECT_EQ(resend.value(4), u" משלוח עד הבית "_s);
     state.OperatorArea = false; // no button opens the details
     EXPECT_EQ(OrderSummaryLines(state, date).value(2), u" משלוח עד הבית "_s);
+}
+
+TEST(OrderFacts, AreInWordsAndLeaveOutWhatIsNotKnown) {
+    const struct {
+        const char* what;
+        void (*arrange)(SessionState&);
+        QString facts;
+    } cases[] = {
+        {"print", [](SessionState&) {},
+         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, no border, the whole picture, uncut|gift"_s},
+        {"branch", [](SessionState& s) { s.BranchChoice = u"Haifa"_s, s.shemot.Hearot = u" - Haifa"_s; },
+         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, no border, the whole picture, uncut|Haifa"_s},
+        {"home",
+         [](SessionState& s) { s.MishloachHabaita = true, s.shemot.n3 = u"5 Herzl"_s, s.shemot.Bord = u"B7"_s; },
+         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, border B7, the whole picture, uncut|to your home, 5 Herzl|gift"_s},
+        {"no log",
+         [](SessionState& s) { s.shemot = {}, s.shemot.n1 = u"NO details"_s, s.shemot.ppr = s.shemot.maat = u"***"_s; },
+         u""_s},
+        {"album",
+         [](SessionState& s) {
+             s.Optint = OrderKind::Album;
+             s.shemot.n1.clear();
+             s.album.ShemZalam = u"Studio Or"_s;
+             s.album.SoogLBM = u"פוטו גדול"_s;
+         },
+         u"Studio Or|03-1234567|13|פוטו גדול|gift"_s},
+    };
+    for (const auto& each : cases) {
+        SessionState state = exampleOrder();
+        state.EnglishTips = 1;
+        each.arrange(state);
+        QStringList facts;
+        for (const OrderFact& fact : OrderFacts(state))
+            facts += fact.text;
+        EXPECT_EQ(facts.join(u'|'), each.facts) << each.what;
+        EXPECT_EQ(CalledName(state), state.Optint == OrderKind::Album ? u"Studio Or"_s
+                                     : each.facts.isEmpty()           ? u""_s
+                                                                      : u"Dana"_s);
+    }
+    EXPECT_EQ(ShortNumber(u"2026_11_21_KUP_1234^105P"_s), u"105"_s);
 }
 
 TEST(OrderSummary, IsDrawnDarkOnWhiteFromTheSideOfItsLanguage) {

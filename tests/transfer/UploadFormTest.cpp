@@ -468,7 +468,7 @@ TEST_F(UploadFormTest, TheWayBackToThePicturesEndsTheCheckAndLeavesNothingBehind
         back.registerBare({PageId::kyoskNew});
         back.state.handOver.basket = {u"021015GNBC:\\pics\\aabb.jpg"_s};
         back.state.transfer.leftOut = {{u"C:\\pics\\gone.jpg"_path}};
-        other.onFetch = [&] { back.page().Command4Hazor_Click(); };
+        other.onFetch = [&] { back.page().changeOrder_Click(), back.page().Command4Hazor_Click(); };
         back.chain.show(PageId::UploadForm);
         back.page().Form_Activate();
         EXPECT_EQ(back.chain.front()->id(), PageId::kyoskNew);

@@ -1,5 +1,8 @@
 #include "PageLook.h"
 
+#include "order/PrintFile.h"
+#include "platform/Platform.h"
+#include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/FakeWebLab.h"
@@ -11,6 +14,7 @@
 #include <QTest>
 
 #include <functional>
+#include <tuple>
 
 namespace lumora {
 
@@ -31,11 +35,21 @@ protected:
         lab.folders[state.profile.FtpFolder2];
         state.MisparHazmana = u"105"_s;
         state.transfer.OrderFolder = u"C:\\2000lumora\\!!000"_path / orderName;
-        for (const QString& name : {u"!105_1234.jpp"_s, first, u"111015GNB0001_03AACC.jpp"_s})
-            write(name, "bytes");
-        write(orderName + u".txt"_s, "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n");
+        state.shemot.ppr = u"10/15"_s;
+        state.shemot.maat = GetParam().english ? u"Glossy"_s : u"מבריק"_s;
+        state.shemot.Bord = u"NB"_s;
+        write(u"!105_1234.jpp"_s, "bytes");
+        write(first, print(1));
+        write(u"111015GNB0001_03AACC.jpp"_s, print(2));
+        write(orderName + u".txt"_s, "\"Shemot.n1\",\"Dana Levi\"\r\n\"Shemot.n2\",\"03-1234567\"\r\n"
+                                     "\"Shemot.Hearot\",\"gift - \"\r\n");
     }
 
+    QByteArray print(int picture) {
+        const auto& [files, state] = std::tie(walk.program().platform().files, walk.program().state());
+        const auto jpeg = files.read(walk.pictureFolder() / u"IMG_00%1.jpg"_s.arg(picture, 2, 10, QChar(u'0')));
+        return *packPrintFile(*jpeg, PrintFileShape::of(state.profile), QByteArray(40, ' '));
+    }
     void write(const QString& name, const QByteArray& bytes) {
         walk.write(walk.program().state().transfer.OrderFolder / name, bytes);
     }
@@ -62,6 +76,9 @@ protected:
         ASSERT_TRUE(QTest::qWaitFor([&] { return page.phase() == phase; }, 30000))
             << qPrintable(page.sendingControls().Label4Do.text);
     }
+    void awaitPrints(const SendingPage& page) {
+        ASSERT_TRUE(QTest::qWaitFor([&] { return !page.prints().empty(); }, 30000));
+    }
     // Looks at the page from within its own work, as soon as it is so far. One after the other.
     void lookWhen(const QString& name, std::function<bool()> soFar) { waits.emplace_back(name, std::move(soFar)); }
     void lookIfDue() {
@@ -85,6 +102,7 @@ protected:
 TEST_P(SendingLook, HasNoFaultByFtpFromTheCountThroughAFailureToTheEnd) {
     auto& page = open<FtpFrm>([](SessionState& state) { state.Waiting = true; });
     until(page, SendingPhase::Countdown);
+    awaitPrints(page);
     go(walk, u":17-countdown Command23 :17-waiting Image3 :20-leave-sending Command14"_s);
 
     lab.putFaults = {{first, FakeLab::always, -1}};
@@ -172,6 +190,7 @@ TEST_P(SendingLook, HasNoFaultByHttpFromTheCheckThroughAFailureToTheEndPanel) {
     auto& page = open<UploadForm>([](SessionState& state) { state.Waiting = true; });
     lookWhen(u"60-http-checking"_s, [&] { return page.controls().Pic4Hamten.visible; });
     until(page, SendingPhase::Countdown);
+    awaitPrints(page);
     go(walk, u":61-http-countdown Command3 :62-http-stopped Command10"_s);
     lookWhen(u"63-http-sending"_s, [&] { return page.controls().percent >= 50; });
     lookWhen(u"64-http-sending-again"_s,

@@ -134,7 +134,7 @@ class Walk:
                 promise['leftOut'] += shown.get('List4Hasserot', '')
             notice = shown.get('Notice', '') if page == 'hatchala' else ''
             if page in SENDING or notice:
-                name = shown.get('Label46') or shown.get('Label15') or shown.get('Label16')
+                name = shown.get('Label46') or shown.get('wholeNumber') or shown.get('Label15') or shown.get('Label16')
                 if notice and promise and kept:
                     number = re.search(r'\d+', notice)[0]
                     name = next((path.name for path in kept.iterdir() if path.name.rstrip('P').endswith('^' + number)), None)

@@ -2,6 +2,7 @@
 
 #include "session/Caption.h"
 #include "session/LeftOutBox.h"
+#include "transfer/delivery/OrderFacts.h"
 
 namespace lumora {
 
@@ -18,6 +19,18 @@ struct SendingControls : Controls {
     Caption Pic4Failure{*this, u"Pic4Failure", Caption::At::Hidden};   // card of the failure, at the end
     Caption Command28{*this, u"Command28", Caption::At::Hidden};       // new order
     Caption Image3{*this, u"Image3"};                                  // close
+
+    Caption changeOrder{*this, u"changeOrder", Caption::At::Hidden}; // back to the pictures
+
+    // What is in the order; a fact that is not known is hidden.
+    ControlArray<Caption, mostFacts> factName{*this, u"factName", Caption::At::Hidden};
+    ControlArray<Caption, mostFacts> fact{*this, u"fact", Caption::At::Hidden};
+
+    // The thank-you, once the order has arrived.
+    Caption thanks{*this, u"thanks", Caption::At::Hidden};
+    Caption shortNumber{*this, u"shortNumber"};
+    Caption nextSteps{*this, u"nextSteps", Caption::At::Hidden}; // what becomes of the order now
+    Caption cardMayGo{*this, u"cardMayGo", Caption::At::Hidden}; // a card is in, and nothing reads it any more
 
     LeftOutControls leftOut{*this};
 

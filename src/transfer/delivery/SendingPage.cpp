@@ -12,6 +12,8 @@
 #include "platform/Platform.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/WayBack.h"
+#include "transfer/delivery/OrderFacts.h"
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"
 #include "transfer/report/ReportOnce.h"
@@ -41,13 +43,19 @@ SendingPage::SendingPage(PageId id, SessionState& state, const Platform& platfor
     , m_countdown(countdown)
     , m_shown(shown)
     , m_leftOut(id, state, chain, shown.leftOut)
-    , Timer4Report(reportTick, [this] { watchReport(); }) {
+    , Timer4Report(reportTick, [this] { watchReport(); })
+    , m_previews(platform.files) {
+    connect(&m_previews, &PrintPreviews::ready, this, &SendingPage::changed);
     connect(&chain, &PageChain::shown, this, [this](Page* page) {
         if (page == this)
             QTimer::singleShot(0, this, &SendingPage::activateWhenFree);
     });
     if (state.transfer.SugMishloah != Sending::NewOrder)
         readLeftOut();
+    connect(&platform.cards, &Cards::changed, this, [this] {
+        showCardMayGo();
+        Q_EMIT changed();
+    });
     // The window may be closed or the page unloaded inside a pump of a sending, which must not go on unseen.
     connect(&chain, &PageChain::ended, this, [this] { leave(); });
     connect(&chain, &PageChain::unloaded, this, [this](Page* page) {
@@ -148,10 +156,35 @@ void SendingPage::goBack() {
         TakeOrderBack(m_state, m_platform);
 }
 
+void SendingPage::endWayBack() {
+    m_wayBack = false;
+    m_leftOut.endWayBack();
+}
+
+bool SendingPage::mayChange() const {
+    const bool counts = m_phase == SendingPhase::Countdown || m_phase == SendingPhase::Waiting;
+    if (!counts || !m_wayBack || lineInUse() || m_leftOut.isOpen() ||
+        m_state.transfer.SugMishloah != Sending::NewOrder || !leadsToPictures(id(), m_state, m_chain))
+        return false;
+    const Result<OrderState> order = ReadOrderState(m_platform.files, OrderFolder::chosen(m_state));
+    return !order || order->phase < OrderState::Phase::Sending;
+}
+
+// What was made of the pictures and copied from a card stays until a sending begins, so that the order finds it again.
+void SendingPage::change() {
+    if (!mayChange())
+        return;
+    stopTimers();
+    if (goBackToPictures(id(), m_state, m_chain))
+        TakeOrderBack(m_state, m_platform);
+}
+
 void SendingPage::enter(SendingPhase phase) {
     m_phase = phase;
     if (isUnderWay(phase))
-        m_leftOut.endWayBack();
+        endWayBack();
+    readPrints();
+    watchCards();
     tellPhase();
     Q_EMIT changed();
 }
@@ -163,8 +196,64 @@ void SendingPage::tellPhase() {
     m_leftOut.show();
     m_shown.Label4Order.text = wording(u"ההזמנה שלך", u"Your order");
     m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
+    m_shown.changeOrder.text = wording(changeWords);
+    m_shown.changeOrder.visible = row.buttons.testFlag(SendingButton::Change) && mayChange();
     showReporting();
+    showFacts();
+    showThanks();
     showPhase(row);
+}
+
+void SendingPage::showPrints() {
+    m_isLookedAt = true;
+    readPrints();
+}
+
+void SendingPage::readPrints() {
+    const OrderFolder order = OrderFolder::chosen(m_state);
+    if (m_isLookedAt && hasOrder(m_phase) && order.isChosen())
+        m_previews.read(order, PrintFileShape::of(m_state.profile));
+}
+
+void SendingPage::showFacts() {
+    QList<OrderFact> facts = hasOrder(m_phase) ? OrderFacts(m_state) : QList<OrderFact>();
+    if (isThanked(m_phase))
+        facts.prepend({wording(u"תאריך", u"Date"), m_platform.clock.now().date().toString(u"dd/MM/yyyy"_s)});
+    for (qsizetype i = 0; i < mostFacts; ++i) {
+        const auto at = static_cast<std::size_t>(i);
+        const OrderFact fact = facts.value(i);
+        m_shown.factName[at].text = fact.name;
+        m_shown.fact[at].text = fact.text;
+        m_shown.factName[at].visible = m_shown.fact[at].visible = !fact.text.isEmpty();
+    }
+}
+
+void SendingPage::showThanks() {
+    const QString name = CalledName(m_state);
+    const bool thanked = isThanked(m_phase);
+    const bool printsNext = m_phase == SendingPhase::Success && !(m_state.Careful && report().isEndUnknown());
+    m_shown.thanks.visible = thanked;
+    m_shown.thanks.text = name.isEmpty() ? wording(thanksWords) : wording(thanksByNameWords).arg(name);
+    m_shown.shortNumber.text = ShortNumber(OrderFolder::chosen(m_state).name());
+    m_shown.nextSteps.visible = thanked && printsNext;
+    m_shown.nextSteps.text = wording(nextStepsWords);
+    showCardMayGo();
+}
+
+void SendingPage::watchCards() {
+    const bool ofCustomer = m_state.transfer.SugMishloah == Sending::NewOrder;
+    if (!ofCustomer || !m_isLookedAt || !isThanked(m_phase) || !m_platform.cards.areWatched())
+        m_cardWatch.reset();
+    else if (!m_cardWatch)
+        m_cardWatch.emplace(m_platform.cards);
+}
+
+// A card that is still being counted is read by this program.
+void SendingPage::showCardMayGo() {
+    const std::vector<Cards::Card> cards = m_cardWatch ? m_platform.cards.all() : std::vector<Cards::Card>();
+    const auto isCounted = [](const Cards::Card& card) { return card.summary.has_value(); };
+    m_shown.cardMayGo.visible = !cards.empty() && std::ranges::all_of(cards, isCounted);
+    m_shown.cardMayGo.text = wording(cardMayGoWords);
 }
 
 void SendingPage::showReporting() {
@@ -289,6 +378,7 @@ bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::I
 
 // The order stays in its folder and is listed among the finished ones.
 void SendingPage::leaveForNewOrder() {
+    m_cardWatch.reset();
     m_state.transfer.leftOut.clear();
     m_chain.follow(id(), Outcome::NewOrderWanted);
 }

@@ -3,10 +3,12 @@
 #include "imaging/Bitmap.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderState.h"
+#include "platform/media/Cards.h"
 #include "session/Page.h"
 #include "session/Ticker.h"
 #include "transfer/delivery/Countdown.h"
 #include "transfer/delivery/PreparedAgain.h"
+#include "transfer/delivery/PrintPreviews.h"
 #include "transfer/delivery/SendingControls.h"
 #include "transfer/delivery/SendingEvents.h"
 #include "transfer/delivery/SendingPhase.h"
@@ -39,6 +41,7 @@ public:
     void Command4Dooach_Click() { reportAgain(); } // in the operator's area
     void Command4Bli_Click() { goOnWithout(); }    // in the box of left out pictures
     void Command4Hazor_Click() { goBack(); }
+    void changeOrder_Click() { change(); }
 
     SendingPhase phase() const { return m_phase; }
     const PhaseLook& look() const;
@@ -57,6 +60,9 @@ public:
 
     // As SmallLeftOut().
     Bitmap smallLeftOut(int index, int cell) const;
+    // The first prints of the order. They are read only where somebody looks at the page.
+    void showPrints();
+    const std::vector<Bitmap>& prints() const { return m_previews.pictures(); }
 
     // What the operator's area shows of the order. A telling that was begun may have been heard or not.
     bool reportUnknown() const;
@@ -106,7 +112,7 @@ protected:
     const QString& reason() const { return m_reason; } // empty: no failure is to be told
     void tellLab();
     // A file of the order may lie on a server.
-    void endWayBack() { m_leftOut.endWayBack(); }
+    void endWayBack();
     void leaveForNewOrder();
     void leaveProgram();
 
@@ -122,8 +128,16 @@ protected:
 private:
     QString adviceOf(const PhaseLook& row) const;
     bool goesOnByItself(SendingPhase phase) const;
+    void showFacts();
+    void showThanks();
+    void watchCards();
+    void showCardMayGo();
+    void readPrints();
     void goOnWithout();
     void goBack();
+    // Nothing of the order has left the machine.
+    bool mayChange() const;
+    void change();
     // What the log of an order that is sent again names as failed.
     void readLeftOut();
     void activateWhenFree();
@@ -136,6 +150,10 @@ private:
     SendingControls& m_shown;
     LeftOutBox m_leftOut;
     Ticker Timer4Report; // 1000 ms: the watch over a telling
+    PrintPreviews m_previews;
+    bool m_isLookedAt = false;               // somebody looks at the page
+    bool m_wayBack = true;                   // nothing of the order was sent
+    std::optional<Cards::Watch> m_cardWatch; // of an order that has arrived
     SendingPhase m_phase = SendingPhase::Preparing;
     bool m_activated = false;
     QString m_reason; // what the last failure means

@@ -33,6 +33,15 @@ constexpr bool hasArrived(SendingPhase phase) {
     return phase == SendingPhase::Success || phase == SendingPhase::AllThere || phase == SendingPhase::PartThere;
 }
 
+// The customer is thanked for the whole order.
+constexpr bool isThanked(SendingPhase phase) {
+    return phase == SendingPhase::Success || phase == SendingPhase::AllThere;
+}
+// There is an order to tell of.
+constexpr bool hasOrder(SendingPhase phase) {
+    return phase != SendingPhase::Preparing && phase != SendingPhase::NoOrder && phase != SendingPhase::NumberTaken;
+}
+
 enum class SendingSign { Seconds, Percent, Asking, Good, Held, Unclear, Bad };
 
 enum class SendingButton {
@@ -45,6 +54,7 @@ enum class SendingButton {
     NewOrder = 32,
     Close = 64,
     Refresh = 128,
+    Change = 256, // back to the pictures
 };
 Q_DECLARE_FLAGS(SendingButtons, SendingButton)
 Q_DECLARE_OPERATORS_FOR_FLAGS(SendingButtons)

@@ -39,6 +39,16 @@ inline constexpr SendingWords untoldAdvice{
 inline constexpr SendingWords callLabAdvice{u"ההזמנה שמורה במחשב זה. יש להתקשר למעבדה.",
                                             u"The order is kept on this computer. Please call the lab."};
 
+inline constexpr SendingWords changeWords{u"שינוי ההזמנה", u"Change the order"};
+inline constexpr SendingWords thanksWords{u"תודה!", u"Thank you!"};
+// %1: the customer's first name, which may be of another direction than the sentence.
+inline constexpr SendingWords thanksByNameWords{u"תודה, \u2068%1\u2069!", u"Thank you, \u2068%1\u2069!"};
+inline constexpr SendingWords nextStepsWords{u"עכשיו המעבדה מדפיסה את התמונות.", u"The lab prints your pictures now."};
+// %1: the lab's telephone.
+inline constexpr SendingWords forQuestionsWords{u" לשאלות, לאיסוף ולתשלום: %1",
+                                                u" For questions, collecting and payment: %1"};
+inline constexpr SendingWords cardMayGoWords{u"אפשר להוציא עכשיו את הכרטיס.", u"You can take your card out now."};
+
 inline constexpr SendingWords goesOnByItselfAdvice{
     u"ההזמנה שמורה במחשב זה, ואנחנו ממשיכים לשלוח אותה. אין צורך להמתין.",
     u"Your order is kept on this computer. We go on sending it; you need not wait."};

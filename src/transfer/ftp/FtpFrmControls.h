@@ -24,8 +24,9 @@ struct FtpFrmControls : SendingControls {
     Caption Label4Prints{*this, u"Label4Prints"};                      // pictures in a sentence
     Caption Label15{*this, u"Label15", Caption::At::Hidden};           // home delivery note
     Caption Label4Ktovet{*this, u"Label4Ktovet", Caption::At::Hidden}; // the delivery address
-    Caption Label4Summary{*this, u"Label4Summary"};                    // heading of the summary
-    Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary, shown at success
+    Caption Picture2{*this, u"Picture2", Caption::At::Hidden};         // the summary, at success
+    Caption numberPrompt{*this, u"numberPrompt"};                      // "your order number", at success
+    Caption wholeNumber{*this, u"wholeNumber"};                        // the name under which the lab has the order
     QStringList Picture2Lines;                                         // its lines; saved as a small picture
     Caption Picture13{*this, u"Picture13", Caption::At::Hidden};       // the proof picture
     DrivePath Picture13File;

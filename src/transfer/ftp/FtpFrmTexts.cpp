@@ -37,11 +37,12 @@ std::span<const PhaseLook> FtpFrm::looks() const {
         PhaseLook{
             SendingPhase::Refused, SendingSign::Bad, SendAgain, {SendAgain, NewOrder}, notCompleteTitle, refusedAdvice},
         PhaseLook{SendingPhase::NoServer, SendingSign::Bad, NewOrder, {NewOrder}, nothingTitle, noServerAdvice},
-        PhaseLook{SendingPhase::Countdown, SendingSign::Seconds, SendNow, {SendNow, Hold}, readyTitle, readyAdvice},
+        PhaseLook{
+            SendingPhase::Countdown, SendingSign::Seconds, SendNow, {SendNow, Hold, Change}, readyTitle, readyAdvice},
         PhaseLook{SendingPhase::Waiting,
                   SendingSign::Seconds,
                   SendNow,
-                  {SendNow, GoOn},
+                  {SendNow, GoOn, Change},
                   sendingTitle,
                   {u"הספירה נעצרה. כדי לשלוח יש ללחוץ על הלחצן שלח עכשיו.",
                    u"The count is stopped. Press Send now to send."}},
@@ -124,7 +125,10 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Command23.text = row.buttons.testFlag(GoOn) ? wording(u"המשך", u"Go on") : wording(u"עצור משלוח", u"Stop sending");
     PicInProgKatan.visible = underWay && inPieces();
     Pic4Failure.visible = ended && (m_incomplete || !reason().isEmpty());
-    Pic4Order.visible = row.phase != SendingPhase::Success; // Picture2 stands in its place
+    Label46.visible = !isThanked(row.phase); // the thank-you has the number
+    wholeNumber.text = Label46.text;
+    if (const QString phone = m_state.profile.LabPhone.trimmed(); !phone.isEmpty())
+        nextSteps.text += wording(forQuestionsWords).arg(phone);
     showMinutes();
     showLabButtons();
 }
@@ -165,8 +169,8 @@ void FtpFrm::setTexts() {
           u"The order is kept on this computer, and files that have arrived are not sent again."},
          {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
          {Label4Minutes, u"דקות", u"minutes"},
+         {numberPrompt, u"מספר ההזמנה שלך", u"Your order number"},
          {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
-         {Label4Summary, u"סיכום ההזמנה", u"Summary of your order"},
          {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
           u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
           u"pictures "

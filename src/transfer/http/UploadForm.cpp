@@ -180,6 +180,11 @@ void UploadForm::stopCount() {
     enter(SendingPhase::Waiting);
 }
 
+void UploadForm::endCount() {
+    if (idle() && phase() == SendingPhase::Countdown)
+        sendMissing();
+}
+
 void UploadForm::goOn() {
     if (idle() && phase() == SendingPhase::Waiting)
         startPanel();
@@ -276,7 +281,6 @@ void UploadForm::succeed() {
         return;
     Label9.visible = Pic4Hamten.visible = Picture1.visible = false;
     Picture6.visible = true;
-    Label16.text = m_orderName;
     enter(SendingPhase::Success);
 }
 

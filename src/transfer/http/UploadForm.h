@@ -29,6 +29,7 @@ public:
     void Command3_Click() { stopCount(); }
     void Command10_Click() { goOn(); }
     void Command15_Click() { stopSending(); }
+    void sendNow_Click() { endCount(); }
     void Command28_Click() { leaveForAnother(); }
     void Image5_Click() { sendAgain(); }
     void Image3_Click() { leaveProgram(); }
@@ -66,6 +67,7 @@ private:
     void findMissing();
     void watchLine() { m_sender.watch(); }
     void stopCount();
+    void endCount();
     void stopSending();
     void goOn();
     void sendAgain();

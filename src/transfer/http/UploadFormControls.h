@@ -27,6 +27,7 @@ struct UploadFormControls : SendingControls {
     Caption Command2{*this, u"Command2", Caption::At::Hidden};   // refresh
     Caption Command3{*this, u"Command3", Caption::At::Hidden};   // stop
     Caption Command10{*this, u"Command10", Caption::At::Hidden}; // continue
+    Caption sendNow{*this, u"sendNow", Caption::At::Hidden};     // without waiting for the count
     Caption Command15{*this, u"Command15", Caption::At::Greyed}; // stop, enabled during a sending
     Caption endClose{*this, u"endClose", Caption::At::Hidden};   // close, at the end
 

@@ -52,11 +52,12 @@ std::span<const PhaseLook> UploadForm::looks() const {
                   {NewOrder, Close, Refresh},
                   notCompleteTitle,
                   noServerAdvice},
-        PhaseLook{SendingPhase::Countdown, SendingSign::Seconds, Hold, {Hold}, readyTitle, readyAdvice},
+        PhaseLook{
+            SendingPhase::Countdown, SendingSign::Seconds, SendNow, {SendNow, Hold, Change}, readyTitle, readyAdvice},
         PhaseLook{SendingPhase::Waiting,
                   SendingSign::Held,
                   GoOn,
-                  {GoOn, NewOrder, Refresh},
+                  {GoOn, NewOrder, Refresh, Change},
                   stoppedTitle,
                   {u"המשלוח נעצר. כדי לשלוח יש ללחוץ על הלחצן המשך את המשלוח.",
                    u"The sending is stopped. Press Continue the sending to send."}},
@@ -91,6 +92,7 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Image5.visible = row.buttons.testFlag(SendAgain);
     Command2.visible = row.buttons.testFlag(Refresh);
     Command3.visible = row.buttons.testFlag(Hold);
+    sendNow.visible = row.buttons.testFlag(SendNow);
     Command15.visible = Command15.enabled = row.buttons.testFlag(Stop);
     Command10.visible = row.buttons.testFlag(GoOn);
     Command10.enabled = !isAnswerAwaited();
@@ -135,10 +137,10 @@ void UploadForm::showLeft() {
     Label4Left.visible = m_left && !hasArrived(phase());
 }
 
-// After success the end panel stands in the place of the order's card.
 void UploadForm::showOrder() {
-    Label15.text = m_orderName;
-    Pic4Order.visible = !m_orderName.isEmpty() && phase() != SendingPhase::Success;
+    Label15.text = Label16.text = m_orderName;
+    Label15.visible = !isThanked(phase()); // the thank-you has the number
+    Pic4Order.visible = hasOrder(phase()) || !m_orderName.isEmpty();
 }
 
 void UploadForm::showAnswers() {
@@ -152,6 +154,7 @@ void UploadForm::setTexts() {
                           {Command3, u"עצור את המשלוח", u"Stop the sending"},
                           {Command10, u"המשך את המשלוח", u"Continue the sending"},
                           {Command15, u"עצור", u"Stop"},
+                          {sendNow, u"שלח עכשיו", u"Send now"},
                           {Command28, u"הזמנה חדשה", u"New order"},
                           {Image3, u"סגור", u"Close"},
                           {endClose, u"סגור", u"Close"},

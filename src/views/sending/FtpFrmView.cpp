@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
+#include "views/kit/PrintFan.h"
 
 #include <QProgressBar>
 
@@ -39,6 +40,7 @@ void FtpFrmView::makeProgress() {
     const Card failure = makeSignedCard("alarm", u"warning"_s, Theme::Colour::Danger);
     bind(failure.frame, c.Pic4Failure);
     add(*failure.column, {label(c.Picture6, "strong"), label(c.Label2), label(c.Label4Reason), label(c.Label9)});
+    makeThanks(c.numberPrompt, c.wholeNumber);
     m_pause = movingBar(FtpFrmControls::Picture1Full);
     bind(u"Picture1"_s, m_pause, [this] { return QString::number(c.Picture1Width); });
     layOut({{blinkingSigns(), 0, Qt::AlignHCenter},
@@ -69,30 +71,26 @@ QWidget* FtpFrmView::blinkingSigns() {
 QLayout* FtpFrmView::makeSide() {
     const Card order = makeCard("card", Pad::Normal);
     bind(order.frame, c.Pic4Order);
+    QWidget* facts = inBox(makeFacts());
+    bind(u"Picture2"_s, facts, [this] { return c.Picture2Lines.join(u'\n'); });
     add(*order.column, {label(c.Label4Order, "smallMuted"),
-                        orderName(c.Label46, "strong"),
-                        label(c.Label4Counts),
+                        facts,
+                        orderName(c.Label46, "smallMuted"),
+                        label(c.Label4Counts, "smallMuted"),
                         {button(c.Image4, Role::Plain, &FtpFrm::Image4_Click, u"folder"_s), 0, Qt::AlignLeading}});
 
     const Card delivery = makeCard("notice", Pad::Normal);
     follow(delivery.frame, c.Label15);
     add(*delivery.column, {label(c.Label15, "strong"), label(c.Label4Ktovet)});
 
-    const Card summary = makeCard("card", Pad::Normal);
-    follow(summary.frame, c.Picture2);
-    m_summary = words("body");
-    bind(u"Picture2"_s, m_summary, [this] { return c.Picture2Lines.join(u'\n'); });
-    add(*summary.column,
-        {inRow(Space::Small, {sign(u"document"_s, IconSize::Line), {label(c.Label4Summary, "large"), 1}}), m_summary});
-
     m_proof = new PictureBox(theme(), this);
     m_proof->setMinimumHeight(theme().size(Extent::Drawing));
     bind(m_proof, c.Picture13);
     QPushButton* fault = button(c.Command22, Role::Plain, &FtpFrm::Command22_Click, u"resend"_s);
     QPushButton* details = button(c.Command24, Role::Quiet, &FtpFrm::Command24_Click, u"info"_s);
-    return inColumn(Space::Normal, {order.frame,
+    return inColumn(Space::Normal, {printFan(),
+                                    order.frame,
                                     delivery.frame,
-                                    summary.frame,
                                     {m_proof, 1},
                                     Item::room(),
                                     {fault, 0, Qt::AlignLeading},
@@ -104,7 +102,7 @@ void FtpFrmView::makeBars() {
     QPushButton* close = button(c.Command11, Role::Secondary, &FtpFrm::Command11_Click);
     QPushButton* stop = button(c.Command15, Role::Secondary, &FtpFrm::Command15_Click, u"stop"_s);
     m_count = button(c.Command23, Role::Secondary, &FtpFrm::Command23_Click, u"pause"_s);
-    frame().addSecondaryActions({close, stop, m_count});
+    frame().addSecondaryActions({close, stop, m_count, makeChange()});
     frame().addStatus(lineLabel(c.Label4Prints, "large"));
     QPushButton* again = button(c.Command10, Role::Main, &FtpFrm::Command10_Click);
     m_sendNow = button(c.Image5, Role::Main, &FtpFrm::Image5_Click);
@@ -126,12 +124,6 @@ void FtpFrmView::render() {
     m_pieces->setVisible(c.PicInProgKatan.visible);
     m_pieces->setValue(c.PicInProgKatanWidth);
     m_pieces->setAccessibleName(c.PicInProgKatan.text);
-    QStringList lines;
-    for (const QString& line : c.Picture2Lines) {
-        if (!line.trimmed().isEmpty())
-            lines += isolated(line.trimmed());
-    }
-    m_summary->setText(lines.join(u'\n'));
     if (std::exchange(m_proofFile, c.Picture13File) != c.Picture13File)
         m_proof->setPicture(loadedPicture(m_files, m_proofFile));
     setIcon(m_count, m_page.look().buttons.testFlag(SendingButton::GoOn) ? u"play"_s : u"pause"_s, Theme::Colour::Ink);

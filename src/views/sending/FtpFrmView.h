@@ -38,7 +38,6 @@ private:
     QProgressBar* m_pieces = nullptr;
     QProgressBar* m_pause = nullptr;
     QWidget* m_chain = nullptr; // the list of its orders
-    QLabel* m_summary = nullptr;
     PictureBox* m_proof = nullptr;
     DrivePath m_proofFile;
     QPushButton* m_sendNow = nullptr;

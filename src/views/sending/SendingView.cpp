@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
+#include "views/kit/PrintFan.h"
 
 #include <QListWidget>
 #include <QProgressBar>
@@ -20,16 +21,52 @@ SendingView::SendingView(SendingPage& page, const SessionState& state, const The
           [&page] { page.Command4Hazor_Click(); },
           [&page](int index, int cell) { return page.smallLeftOut(index, cell); })
     , m_page(page)
-    , m_gauge(new Gauge(theme, this)) {
+    , m_gauge(new Gauge(theme, this))
+    , m_fan(new PrintFan(theme, this)) {
+    page.showPrints();
     frame().steps().setStep(OrderStep::Sending);
 }
 
 void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side) {
-    QVBoxLayout* progress = inColumn(Space::Small, {Item::room(), {m_gauge, 0, Qt::AlignCenter}, Space::Wide});
+    QVBoxLayout* progress =
+        inColumn(Space::Small, {Item::room(), {m_gauge, 0, Qt::AlignCenter}, m_thanks, Space::Wide});
     add(*progress, lines);
-    add(*progress, {Item::room(), makeLeftOutCard()});
+    const SendingControls& shown = m_page.sendingControls();
+    const Card card = makeSignedCard("success", u"tick"_s, Theme::Colour::Good);
+    add(*card.column, {label(shown.cardMayGo, "strong")});
+    follow(card.frame, shown.cardMayGo);
+    add(*progress, {centred(label(shown.nextSteps)), card.frame, Item::room(), makeLeftOutCard()});
     add(*progress, troubles);
     frame().content()->addLayout(inRow(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}), 1);
+}
+
+void SendingView::makeThanks(const Caption& prompt, const Caption& whole) {
+    const SendingControls& shown = m_page.sendingControls();
+    const auto fromItsSide = [this](const QString& text) { return atLineStart(text, state().english()); };
+    m_thanks = inBox(inColumn(Space::None, {centred(label(shown.thanks, "display", fromItsSide)), Space::Normal,
+                                            centred(label(prompt, "muted")), centred(label(shown.shortNumber, "giant")),
+                                            centred(orderName(whole, "smallMuted"))}));
+    follow(m_thanks, shown.thanks);
+}
+
+QLayout* SendingView::makeFacts() {
+    const SendingControls& shown = m_page.sendingControls();
+    const auto fromItsSide = [this](const QString& text) { return atLineStart(isolated(text), state().english()); };
+    QGridLayout* facts = inGrid(Space::Tight);
+    facts->setHorizontalSpacing(theme().size(Space::Normal));
+    for (int i = 0; i < mostFacts; ++i) {
+        const auto at = static_cast<std::size_t>(i);
+        facts->addWidget(lineLabel(shown.factName[at], "muted"), i, 0, Qt::AlignTop);
+        facts->addWidget(label(shown.fact[at], "strong", fromItsSide), i, 1);
+    }
+    facts->setColumnStretch(1, 1);
+    return facts;
+}
+
+QPushButton* SendingView::makeChange() {
+    return button(
+        m_page.sendingControls().changeOrder, Role::Secondary, [&page = m_page] { page.changeOrder_Click(); },
+        u"pictures"_s);
 }
 
 QLabel* SendingView::orderName(const Caption& caption, const char* type) {
@@ -109,6 +146,7 @@ void SendingView::render() {
     frame().steps().setStep(hasArrived(look.phase) ? OrderStep::Done : OrderStep::Sending);
     frame().setTitle(shown.Label4Title.text);
     renderGauge();
+    renderPrints();
     for (const auto& [heading, list] : m_headed)
         speak(list, heading->text);
     changeRole(m_mainActions.at(SendingButton::NewOrder), look.main == SendingButton::NewOrder ? "main" : "secondary");
@@ -122,7 +160,17 @@ void SendingView::render() {
         main->setFocus(Qt::OtherFocusReason);
 }
 
+void SendingView::renderPrints() {
+    std::vector<QImage> prints;
+    for (const Bitmap& print : m_page.prints())
+        prints.push_back(print.image());
+    m_fan->setPrints(std::move(prints));
+    m_fan->setVisible(hasOrder(m_page.phase()));
+    m_fan->setAccessibleName(wording(u"התמונות הראשונות בהזמנה"_s, u"The first pictures of the order"_s));
+}
+
 void SendingView::renderGauge() {
+    m_gauge->setVisible(!m_page.sendingControls().thanks.visible);
     static const std::map<SendingSign, Gauge::Mood> moods = {{SendingSign::Good, Gauge::Mood::Good},
                                                              {SendingSign::Held, Gauge::Mood::Held},
                                                              {SendingSign::Unclear, Gauge::Mood::Unclear},

@@ -12,6 +12,7 @@ namespace lumora {
 
 class Gauge;
 class Overlay;
+class PrintFan;
 
 // The base of the two sending views: title, gauge, the main action of the phase and the keyboard that goes with it.
 class SendingView : public LeftOutView {
@@ -19,9 +20,15 @@ class SendingView : public LeftOutView {
 protected:
     SendingView(SendingPage& page, const SessionState& state, const Theme& theme);
 
-    // The two halves of the page: how the sending stands, and what it is about. The first holds the gauge, the lines
-    // below it and the cards of what went wrong.
+    // The two halves of the page: how the sending stands, and what it is about. The first holds the gauge or the
+    // thank-you, the lines below and the cards of what went wrong.
     void layOut(std::initializer_list<Item> lines, std::initializer_list<Item> troubles, QLayout* side);
+    // Takes the place of the gauge once the order has arrived. prompt and whole: of the order's number.
+    void makeThanks(const Caption& prompt, const Caption& whole);
+    // The first prints, and below them what is in the order.
+    PrintFan* printFan() const { return m_fan; }
+    QLayout* makeFacts();
+    QPushButton* makeChange();
     // A label of an order's name, which keeps its own direction and may break behind each underscore.
     QLabel* orderName(const Caption& caption, const char* type);
     // The button that is the main action in the phases whose row names it.
@@ -44,9 +51,12 @@ protected:
 
 private:
     void renderGauge();
+    void renderPrints();
 
     SendingPage& m_page;
     Gauge* m_gauge;
+    QWidget* m_thanks = nullptr;
+    PrintFan* m_fan;
     std::map<SendingButton, QPushButton*> m_mainActions;
     std::vector<std::pair<const Caption*, QListWidget*>> m_headed;
     QWidget* m_main = nullptr; // what had the keyboard last

@@ -1,6 +1,7 @@
 #include "views/sending/UploadFormView.h"
 
 #include "views/kit/Overlay.h"
+#include "views/kit/PrintFan.h"
 
 #include <QPlainTextEdit>
 #include <QProgressBar>
@@ -20,6 +21,7 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
     const Card failure = makeSignedCard("alarm", u"warning"_s, Theme::Colour::Danger);
     add(*failure.column, {label(c.Label1, "strong"), label(c.Label4Reason)});
     bind(failure.frame, c.Pic4Failure);
+    makeThanks(c.Label4Rshom, c.Label16);
     m_count = movingBar(UploadFormControls::Picture1FullWidth);
     bind(u"Picture1"_s, m_count, [this] { return QString::number(c.Picture1Width); });
     m_pause = movingBar(UploadFormControls::Pic4HamtenFull);
@@ -42,30 +44,34 @@ UploadFormView::UploadFormView(UploadForm& page, const SessionState& state, cons
 QLayout* UploadFormView::makeSide() {
     const Card order = makeCard("card", Pad::Normal);
     bind(order.frame, c.Pic4Order);
-    add(*order.column,
-        {label(c.Label4Order, "smallMuted"), orderName(c.Label15, "strong"), label(c.Label4Left), label(c.Label4Tel)});
+    m_telephone = echo(c.Label4Tel, "smallMuted");
+    add(*order.column, {label(c.Label4Order, "smallMuted"), makeFacts(), orderName(c.Label15, "smallMuted"),
+                        label(c.Label4Left, "smallMuted"), m_telephone});
     const Card end = makeCard("notice", Pad::Normal);
     bind(end.frame, c.Picture6);
-    add(*end.column, {label(c.Label4Alu, "large"), label(c.Label4Rshom), orderName(c.Label16, "large"),
-                      label(c.Label4Tashlum), echo(c.Label4Tel, "large")});
+    add(*end.column, {label(c.Label4Alu, "large"), label(c.Label4Tashlum), label(c.Label4Tel, "large")});
     QPushButton* refresh = button(c.Command2, Role::Quiet, &UploadForm::Command2_Click, u"resend"_s);
     QPushButton* details = button(c.Command24, Role::Quiet, &UploadForm::Command24_Click, u"info"_s);
-    return inColumn(
-        Space::Normal,
-        {order.frame, end.frame, Item::room(), {refresh, 0, Qt::AlignLeading}, {details, 0, Qt::AlignLeading}});
+    return inColumn(Space::Normal, {printFan(),
+                                    order.frame,
+                                    end.frame,
+                                    Item::room(),
+                                    {refresh, 0, Qt::AlignLeading},
+                                    {details, 0, Qt::AlignLeading}});
 }
 
 void UploadFormView::makeBars() {
     frame().addHeaderAction(button(c.Image3, Role::Quiet, &UploadForm::Image3_Click, u"exit"_s));
-    m_stop = button(c.Command3, Role::Secondary, &UploadForm::Command3_Click, u"pause"_s);
+    m_sendNow = button(c.sendNow, Role::Main, &UploadForm::sendNow_Click);
     QPushButton* goOn = button(c.Command10, Role::Main, &UploadForm::Command10_Click);
     QPushButton* again = button(c.Image5, Role::Main, &UploadForm::Image5_Click);
-    frame().addSecondaryActions({asMain(SendingButton::Hold, m_stop),
+    frame().addSecondaryActions({button(c.Command3, Role::Secondary, &UploadForm::Command3_Click, u"pause"_s),
                                  button(c.Command15, Role::Secondary, &UploadForm::Command15_Click, u"stop"_s),
-                                 button(c.endClose, Role::Secondary, &UploadForm::Image3_Click)});
+                                 button(c.endClose, Role::Secondary, &UploadForm::Image3_Click), makeChange()});
     frame().addMainActions(
         {asMain(SendingButton::NewOrder, button(c.Command28, Role::Secondary, &UploadForm::Command28_Click)),
-         asMain(SendingButton::GoOn, goOn), asMain(SendingButton::SendAgain, again)});
+         asMain(SendingButton::GoOn, goOn), asMain(SendingButton::SendNow, m_sendNow),
+         asMain(SendingButton::SendAgain, again)});
 }
 
 QPlainTextEdit* UploadFormView::answer(const Caption& caption) {
@@ -110,6 +116,8 @@ bool UploadFormView::leave() {
 
 void UploadFormView::render() {
     SendingView::render();
+    if (c.Picture6.visible)
+        m_telephone->hide(); // the end panel has it
     m_count->setVisible(c.Pic4Timer.visible);
     m_count->setValue(c.Picture1Width);
     m_pause->setVisible(c.Pic4Hamten.visible);

@@ -11,7 +11,7 @@ class UploadFormView : public ViewOf<UploadForm, SendingView> {
     Q_OBJECT
 public:
     UploadFormView(UploadForm& page, const SessionState& state, const Theme& theme);
-    QWidget* firstFocus() const override { return m_stop; }
+    QWidget* firstFocus() const override { return m_sendNow; }
     bool leave() override;
 
 protected:
@@ -23,7 +23,8 @@ private:
     void makeLabArea();
     QPlainTextEdit* answer(const Caption& caption);
 
-    QPushButton* m_stop = nullptr;
+    QPushButton* m_sendNow = nullptr;
+    QLabel* m_telephone = nullptr;
     QProgressBar* m_count = nullptr;
     QProgressBar* m_pause = nullptr;
     QPlainTextEdit* m_answer = nullptr;
