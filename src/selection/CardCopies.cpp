@@ -3,7 +3,6 @@
 #include "common/HostFile.h"
 
 #include <algorithm>
-#include <mutex>
 #include <thread>
 
 namespace lumora {
@@ -22,21 +21,11 @@ bool hasRoom(const HostPath& target, std::uintmax_t bytes) {
 
 } // namespace
 
-struct CardCopies::Desk {
-    std::mutex mutex;
-    CardCopies* copies;
-};
-
 CardCopies::CardCopies(const Files& files, const DrivePath& orderFolder)
-    : m_kept(files, orderFolder)
-    , m_desk(std::make_shared<Desk>()) {
-    m_desk->copies = this;
-}
+    : m_kept(files, orderFolder) {}
 
 CardCopies::~CardCopies() {
     m_stop.request_stop();
-    const std::lock_guard lock(m_desk->mutex);
-    m_desk->copies = nullptr;
 }
 
 void CardCopies::want(const std::vector<Picture>& chosen, bool again) {
@@ -70,14 +59,10 @@ void CardCopies::startNext() {
     m_queue.pop_front();
     m_running = m_copies[picture.path].inHand = true;
     const Result<HostPath> target = m_kept.targetOf(DrivePath(picture.path));
-    std::thread([desk = m_desk, picture, target, stop = m_stop.get_token()] {
+    std::thread([ticket = m_desk.ticket(), picture, target, stop = m_stop.get_token()] {
         const Copy copy = target ? copyWhole(picture, *target, stop)
                                  : Copy{State::NotKept, targetFailure(target.failure()), false, picture.source.stamp};
-        const std::lock_guard lock(desk->mutex);
-        CardCopies* copies = desk->copies;
-        if (copies)
-            QMetaObject::invokeMethod(
-                copies, [copies, path = picture.path, copy] { copies->settle(path, copy); }, Qt::QueuedConnection);
+        ticket.handIn([path = picture.path, copy](CardCopies& copies) { copies.settle(path, copy); });
     }).detach();
 }
 

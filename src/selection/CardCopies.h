@@ -1,12 +1,12 @@
 #pragma once
 
+#include "common/ResultDesk.h"
 #include "order/KeptPictures.h"
 
 #include <QHash>
 #include <QObject>
 
 #include <deque>
-#include <memory>
 #include <stop_token>
 
 namespace lumora {
@@ -47,7 +47,6 @@ private:
         bool inHand = false;
         PictureStamp stamp = {}; // of the picture that is meant
     };
-    struct Desk; // where a thread hands in its result, also when nobody waits for it any more
 
     static Copy copyWhole(const Picture& picture, const HostPath& target, const std::stop_token& stop);
     bool isKept(const Picture& picture) const;
@@ -59,7 +58,7 @@ private:
     std::deque<Picture> m_queue;
     bool m_running = false;
     std::stop_source m_stop;
-    std::shared_ptr<Desk> m_desk;
+    ResultDesk<CardCopies> m_desk{this};
 };
 
 } // namespace lumora

@@ -13,7 +13,6 @@
 #include <QThreadPool>
 
 #include <algorithm>
-#include <mutex>
 
 namespace lumora {
 
@@ -63,24 +62,14 @@ QThreadPool& decoders() {
 
 } // namespace
 
-struct PictureDoor::Desk {
-    std::mutex mutex;
-    PictureDoor* door;
-};
-
 PictureDoor::PictureDoor(const Files& files, DoorDecoder decoder, DoorRules rules)
     : m_files(files)
     , m_decoder(std::move(decoder))
     , m_rules(rules)
-    , m_kept(files, {})
-    , m_desk(std::make_shared<Desk>()) {
-    m_desk->door = this;
-}
+    , m_kept(files, {}) {}
 
 PictureDoor::~PictureDoor() {
     m_stop.request_stop();
-    const std::lock_guard lock(m_desk->mutex);
-    m_desk->door = nullptr;
 }
 
 PictureDoor::Picture* PictureDoor::find(const QString& worked) {
@@ -274,27 +263,19 @@ void PictureDoor::start(Picture& picture) {
     picture.fromCopy = m_kept.has(path);
     ++m_running;
     const Result<HostPath> target = targetOf(path);
-    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = fileToRead(picture), target,
-                      stop = m_stop.get_token()] {
+    decoders().start([ticket = m_desk.ticket(), decoder = m_decoder, worked = picture.worked,
+                      source = fileToRead(picture), target, stop = m_stop.get_token()] {
         const Result<qint64> made = target ? makePicture(decoder, source, *target, stop) : target.failure();
-        const std::lock_guard lock(desk->mutex);
-        PictureDoor* door = desk->door;
-        if (door)
-            QMetaObject::invokeMethod(
-                door, [door, worked, made] { door->settle(worked, made); }, Qt::QueuedConnection);
+        ticket.handIn([worked, made](PictureDoor& door) { door.settle(worked, made); });
     });
 }
 
 void PictureDoor::startDraft(const Picture& picture) {
     ++m_running;
-    decoders().start([desk = m_desk, decoder = m_decoder, worked = picture.worked, source = fileToRead(picture),
-                      stop = m_stop.get_token()] {
+    decoders().start([ticket = m_desk.ticket(), decoder = m_decoder, worked = picture.worked,
+                      source = fileToRead(picture), stop = m_stop.get_token()] {
         const Result<QByteArray> draft = decoder.draft(source, stop);
-        const std::lock_guard lock(desk->mutex);
-        PictureDoor* door = desk->door;
-        if (door)
-            QMetaObject::invokeMethod(
-                door, [door, worked, draft] { door->settleDraft(worked, draft); }, Qt::QueuedConnection);
+        ticket.handIn([worked, draft](PictureDoor& door) { door.settleDraft(worked, draft); });
     });
 }
 

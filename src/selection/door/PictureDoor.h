@@ -3,6 +3,7 @@
 #include "common/DoorRules.h"
 #include "common/DrivePath.h"
 #include "common/Result.h"
+#include "common/ResultDesk.h"
 #include "door/DoorDecoder.h"
 #include "imaging/Bitmap.h"
 #include "order/KeptPictures.h"
@@ -14,7 +15,6 @@
 
 #include <deque>
 #include <functional>
-#include <memory>
 #include <stop_token>
 #include <utility>
 
@@ -96,7 +96,6 @@ private:
         bool draftAsked = false;
         QByteArray draft; // a JPEG file, while the picture is waiting
     };
-    struct Desk; // where a thread hands in its result, also when the door has gone
 
     Picture* find(const QString& worked);
     const Picture* find(const QString& worked) const;
@@ -133,7 +132,7 @@ private:
     qint64 m_room = qint64(2) << 30;
     int m_running = 0;
     std::stop_source m_stop; // of what is being made
-    std::shared_ptr<Desk> m_desk;
+    ResultDesk<PictureDoor> m_desk{this};
 };
 
 } // namespace lumora

@@ -9,7 +9,6 @@
 #include <QImageReader>
 
 #include <algorithm>
-#include <mutex>
 #include <thread>
 #include <utility>
 
@@ -55,46 +54,27 @@ std::vector<HostPath> firstPrints(const Files& files, const OrderFolder& folder)
 
 } // namespace
 
-struct PrintPreviews::Desk {
-    std::mutex mutex;
-    PrintPreviews* previews;
-};
-
-PrintPreviews::PrintPreviews(const Files& files)
-    : m_files(files)
-    , m_desk(std::make_shared<Desk>()) {
-    m_desk->previews = this;
-}
-
-PrintPreviews::~PrintPreviews() {
-    const std::lock_guard lock(m_desk->mutex);
-    m_desk->previews = nullptr;
-}
-
 void PrintPreviews::read(const OrderFolder& folder, PrintFileShape shape) {
     const QString path = folder.path().text();
     if (m_folder == path)
         return;
     m_folder = path;
     m_pictures.clear();
-    std::thread([desk = m_desk, path, shape, prints = firstPrints(m_files, folder)] {
+    std::thread([ticket = m_desk.ticket(), path, shape, prints = firstPrints(m_files, folder)] {
         std::vector<Bitmap> pictures;
         for (const HostPath& print : prints) {
             if (Bitmap picture = previewOf(print, shape); !picture.isNull())
                 pictures.push_back(std::move(picture));
         }
-        const std::lock_guard lock(desk->mutex);
-        PrintPreviews* previews = desk->previews;
-        if (!previews || pictures.empty())
-            return;
-        const auto handIn = [previews, path, pictures] {
-            if (previews->m_folder != path)
-                return;
-            previews->m_pictures = pictures;
-            Q_EMIT previews->ready();
-        };
-        QMetaObject::invokeMethod(previews, handIn, Qt::QueuedConnection);
+        ticket.handIn([path, pictures](PrintPreviews& previews) { previews.settle(path, pictures); });
     }).detach();
+}
+
+void PrintPreviews::settle(const QString& folder, const std::vector<Bitmap>& pictures) {
+    if (m_folder != folder || pictures.empty())
+        return;
+    m_pictures = pictures;
+    Q_EMIT ready();
 }
 
 } // namespace lumora

@@ -1,11 +1,11 @@
 #pragma once
 
+#include "common/ResultDesk.h"
 #include "imaging/Bitmap.h"
 #include "order/PrintFile.h"
 
 #include <QObject>
 
-#include <memory>
 #include <vector>
 
 namespace lumora {
@@ -21,8 +21,8 @@ public:
     static constexpr int most = 5;
     static constexpr int side = 480; // pixels of the longer side
 
-    explicit PrintPreviews(const Files& files);
-    ~PrintPreviews() override;
+    explicit PrintPreviews(const Files& files)
+        : m_files(files) {}
 
     // Reads those of the folder, each folder once. Ready where there is any.
     void read(const OrderFolder& folder, PrintFileShape shape);
@@ -33,12 +33,12 @@ Q_SIGNALS:
     void ready();
 
 private:
-    struct Desk; // where the thread hands in its result, also when nobody waits for it any more
+    void settle(const QString& folder, const std::vector<Bitmap>& pictures);
 
     const Files& m_files;
     QString m_folder;
     std::vector<Bitmap> m_pictures;
-    std::shared_ptr<Desk> m_desk;
+    ResultDesk<PrintPreviews> m_desk{this};
 };
 
 } // namespace lumora
