@@ -1,6 +1,8 @@
 #include "order/CompletenessGuard.h"
 
 #include "order/OrderCompleteness.h"
+#include "platform/Dialogs.h"
+#include "platform/Platform.h"
 #include "session/SessionState.h"
 
 namespace lumora {
@@ -10,7 +12,7 @@ bool CompletenessGuard::maySend(const OrderCompleteness& counts) const {
         return true;
     switch (counts.verdict()) {
     case OrderCompleteness::Verdict::None:
-        tellNoPicture(counts);
+        m_platform.dialogs.message(whatIsMissing(counts));
         return false;
     case OrderCompleteness::Verdict::Fewer:
         return askForFewer(counts);

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QString>
+
 namespace lumora {
 
 struct OrderCompleteness;
@@ -16,10 +18,10 @@ public:
 
     // Shows a message or a question, whose loop may close the page.
     bool maySend(const OrderCompleteness& counts) const;
+    // What an order lacks that does not leave, or not before a question.
+    QString whatIsMissing(const OrderCompleteness& counts) const;
 
 private:
-    // The words, in CompletenessGuardTexts.cpp.
-    void tellNoPicture(const OrderCompleteness& counts) const;
     bool askForFewer(const OrderCompleteness& counts) const;
 
     const SessionState& m_state;

@@ -300,6 +300,13 @@ TEST_F(FinishedOrders, EachPackageStaysUntilTheClockHasCountedThreeMinutes) {
     EXPECT_FALSE(page.controls().Label24.visible);
     EXPECT_EQ(page.controls().Label4Shaa.text, u"09:50:00") << "the timer runs on";
     EXPECT_TRUE(machine.mail.messages.isEmpty()) << "no mail server is set up";
+
+    chain.unload(PageId::MoogMeret);
+    state.Careful = true;
+    MoogMeret& careful = startWith(whole);
+    EXPECT_TRUE(careful.controls().Label4EinDoar.visible && !careful.controls().Command2.enabled);
+    careful.Command2_Click();
+    EXPECT_EQ(careful.phase(), MoogMeret::Phase::Picked) << "nothing is played that is not sent";
 }
 
 TEST_F(FinishedOrders, AWalkThatIsStoppedStandsAndBeginsAnewWithTheFilesMarkedThen) {

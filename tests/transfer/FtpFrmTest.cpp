@@ -119,6 +119,8 @@ TEST(FtpFrm, EndsAsTheCustomerIsTold) {
         EXPECT_EQ(page.phase(), each.end);
         EXPECT_EQ(shown.Label3.text, each.status);
         EXPECT_EQ(shown.Picture6.visible, each.end == SendingPhase::NotAll);
+        const int files = each.end == SendingPhase::Unclear ? 3 : 5; // as many as the failure tells of
+        EXPECT_TRUE(shown.Label4Counts.text.endsWith(u" %1 קבצים"_s.arg(files)));
         EXPECT_EQ(shown.Label34.visible && shown.Label34.text.startsWith(u"נסיון רביעי"_s),
                   each.end == SendingPhase::NotAll);
         EXPECT_EQ(shown.Command10.visible, !hasArrived(each.end));

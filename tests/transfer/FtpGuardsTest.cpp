@@ -77,6 +77,8 @@ TEST(FtpGuards, CarefullyAnOrderThatLacksPicturesLeavesOnlyAtTheCustomersWord) {
                 EXPECT_TRUE(order.rig.test.dialogs.questions[0].contains(u"2 תמונות, ורק 1"_s));
             }
             if (careful && each.phase == SendingPhase::Refused) {
+                EXPECT_TRUE(
+                    order.rig.page().whyItEnded().english.contains(each.questions > 0 ? u"only 1"_s : u"no picture"_s));
                 order.rig.page().Command4_Click();
                 EXPECT_TRUE(order.lab.puts.isEmpty()) << "no other button sends what was refused";
                 order.rig.test.dialogs.answers = {true};

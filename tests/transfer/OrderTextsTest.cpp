@@ -31,12 +31,12 @@ TEST(OrderFacts, AreInWordsAndLeaveOutWhatIsNotKnown) {
         QString facts;
     } cases[] = {
         {"print", [](SessionState&) {},
-         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, no border, the whole picture, uncut|gift"_s},
+         u"Dana Levi|03-1234567|13|10/15 cm, Glossy, no border, the whole picture, uncut|gift"_s},
         {"branch", [](SessionState& s) { s.BranchChoice = u"Haifa"_s, s.shemot.Hearot = u" - Haifa"_s; },
-         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, no border, the whole picture, uncut|Haifa"_s},
+         u"Dana Levi|03-1234567|13|10/15 cm, Glossy, no border, the whole picture, uncut|Haifa"_s},
         {"home",
          [](SessionState& s) { s.MishloachHabaita = true, s.shemot.n3 = u"5 Herzl"_s, s.shemot.Bord = u"B7"_s; },
-         u"Dana Levi|03-1234567|13|10/15 cm, מבריק, border B7, the whole picture, uncut|to your home, 5 Herzl|gift"_s},
+         u"Dana Levi|03-1234567|13|10/15 cm, Glossy, border B7 (black, narrow), the whole picture, uncut|to your home, 5 Herzl|gift"_s},
         {"no log",
          [](SessionState& s) { s.shemot = {}, s.shemot.n1 = u"NO details"_s, s.shemot.ppr = s.shemot.maat = u"***"_s; },
          u""_s},

@@ -101,6 +101,8 @@ void MoogMeret::enter(Phase phase) {
     }
     for (const auto& [control, in] : shownBy)
         (this->*control).visible = in[static_cast<std::size_t>(phase)];
+    Command2.enabled = mailIsOffered();
+    Label4EinDoar.visible = Command2.visible && !Command2.enabled;
     Q_EMIT changed();
 }
 
@@ -283,7 +285,7 @@ void MoogMeret::sendAgain() {
 
 // Both buttons of sending are hidden until the box is closed.
 void MoogMeret::tellNothingIsMarked(const QString& words) {
-    Command2.visible = Command4.visible = false;
+    Command2.visible = Command4.visible = Label4EinDoar.visible = false;
     Q_EMIT changed();
     m_platform.dialogs.message(words);
     enter(m_phase);

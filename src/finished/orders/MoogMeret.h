@@ -72,11 +72,12 @@ struct MoogMeretControls : Controls {
     Bitmap Picture1; // null when the file is no picture
     Scroll HScroll1;
     Scroll VScroll1;
-    Caption Label4Tmuna{*this, u"Label4Tmuna"}; // spoken description of the preview
-    Caption Command4{*this, u"Command4"};       // send again
-    Caption Command2{*this, u"Command2"};       // send by mail
-    Caption Command6{*this, u"Command6"};       // leave the program
-    Caption Command28{*this, u"Command28"};     // new order
+    Caption Label4Tmuna{*this, u"Label4Tmuna"};                          // spoken description of the preview
+    Caption Command4{*this, u"Command4"};                                // send again
+    Caption Command2{*this, u"Command2"};                                // send by mail
+    Caption Label4EinDoar{*this, u"Label4EinDoar", Caption::At::Hidden}; // why it can't be
+    Caption Command6{*this, u"Command6"};                                // leave the program
+    Caption Command28{*this, u"Command28"};                              // new order
     Caption Command4Orders{*this, u"Command4Orders", Caption::At::Hidden};
 
     TextList List1{*this, u"List1"};            // files to send, full paths; the current one is the present package
@@ -215,6 +216,7 @@ private:
     bool asksToGoOnWithoutGone(const UnfinishedOrder& order);
     bool asksToThrowAway(const QString& number);
     bool asksToGiveUp(const QString& number);
+    void tellNotGivenUp(const Failure& failure);
     QString waitingRow(const UnfinishedOrder& order) const;
     bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
 
@@ -235,6 +237,7 @@ private:
     void showWalk();
     void showOutcome();
     bool mailSetUp() const { return m_state.profile.mail.setUp(); }
+    bool mailIsOffered() const { return mailSetUp() || !m_state.Careful; }
     OrderDetails detailsOf(const DrivePath& folder) const;
 
     SessionState& m_state;

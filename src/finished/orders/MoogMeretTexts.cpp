@@ -1,5 +1,6 @@
 // The wording of the page of finished orders.
 #include "common/DrivePath.h"
+#include "common/Warning.h"
 #include "finished/orders/MoogMeret.h"
 #include "order/FinishedOrder.h"
 #include "order/OrderFolder.h"
@@ -32,6 +33,8 @@ void MoogMeret::setTexts() {
             {Command21, u"בטל את כל הבחירה", u"Cancel the whole choice"},
             {Command4, u"   בצע משלוח", u"   Send now"},
             {Command2, u"שלח בדואר אלקטרוני", u"Send by e-mail"},
+            {Label4EinDoar, u"לא הוגדר כאן שרת דואר, ולכן אי אפשר לשלוח בדואר.",
+             u"No mail server is set up here, so nothing can be sent by mail."},
             {Command5, u"רענן רשימת הזמנות", u"Refresh the list"},
             {Command6, u"בטל הכל וצא מהתוכנה", u"Cancel all and leave the program"},
             {Command28, u"הזמנה חדשה", u"New order"},
@@ -83,6 +86,16 @@ bool MoogMeret::asksToGiveUp(const QString& number) {
     return asks(u"הזמנה מספר %1 לא תישלח עוד מעצמה. התיקייה שלה נשארת במחשב זה. לוותר עליה?",
                 u"Order number %1 will not be sent by itself any more. Its folder stays on this computer. Give it up?",
                 {number});
+}
+
+void MoogMeret::tellNotGivenUp(const Failure& failure) {
+    writeWarning(failure.message);
+    m_platform.dialogs.message(
+        m_state.wording(u"הוויתור לא נרשם במחשב זה, וההזמנה תמשיך להישלח.\nיש לפנות מקום בדיסק או "
+                        u"לתקן את ההרשאות של תיקיית הנתונים.",
+                        u"This can't be written on this computer, and the order goes on being "
+                        u"sent.\nFree some disk space, or correct the permissions of the data "
+                        u"folder."));
 }
 
 bool MoogMeret::asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers) {

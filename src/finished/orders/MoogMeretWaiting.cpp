@@ -50,7 +50,7 @@ void MoogMeret::giveUp() {
     if (!asksToGiveUp(order.state.number) || !mayAct())
         return;
     if (const Result<void> kept = OrderJournal(m_platform.files, order.folder).givenUp(); !kept)
-        m_platform.dialogs.message(kept.failure().message);
+        tellNotGivenUp(kept.failure());
     refreshOrders();
 }
 

@@ -32,7 +32,7 @@ int MoogMeret::packagesDone() const {
 }
 
 void MoogMeret::sendByMail() {
-    if (!mayAct())
+    if (!mayAct() || !mailIsOffered())
         return;
     if (asksToGoOn()) {
         walkFrom(m_walk.nextUnsent(-1));

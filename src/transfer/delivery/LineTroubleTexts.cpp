@@ -6,6 +6,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+// When to try again is said once, by the advice of the phase.
 QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject) {
     const bool answered = failure.kind == Failure::Kind::Refused || failure.kind == Failure::Kind::AccessDenied;
     // Isolating marks: the name may run in the other direction than the sentence.
@@ -25,9 +26,8 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
                                  u"אפשר לנסות שוב או להודיע לחנות."_s,
                                  u"The server refused the login: the user name or the password may be "
                                  u"wrong, or the server is busy. Try again, or tell the shop."_s);
-        return state.wording(u"השרת אינו עונה. יש לבדוק את החיבור לאינטרנט ולנסות שוב בעוד כמה דקות."_s,
-                             u"The server does not answer. Check the internet connection and try again "
-                             u"in a few minutes."_s);
+        return state.wording(u"השרת אינו עונה. יש לבדוק את החיבור לאינטרנט."_s,
+                             u"The server does not answer. Please check the internet connection."_s);
     case LineStep::OrderFolder:
         if (answered)
             return state.wording(u"השרת לא פתח את תיקיית ההזמנה. יש להודיע על כך לחנות."_s,
@@ -88,9 +88,8 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
             u"Another order of the same name has come into the folder on the server, so this one may not be whole "
             u"there. Please call the lab."_s);
     case LineStep::Silence:
-        return state.wording(u"השרת אינו עונה או שהקו איטי מדי, ולכן השליחה הופסקה. יש לנסות שוב מאוחר יותר."_s,
-                             u"The server does not answer or the line is too slow, so the sending has ended. Please "
-                             u"try again later."_s);
+        return state.wording(u"השרת אינו עונה או שהקו איטי מדי, ולכן השליחה הופסקה."_s,
+                             u"The server does not answer or the line is too slow, so the sending has ended."_s);
     }
     return failure.message;
 }

@@ -1,6 +1,7 @@
 #include "transfer/delivery/OrderFacts.h"
 
 #include "common/PaperSize.h"
+#include "order/ChoiceWords.h"
 #include "order/OrderNames.h"
 #include "session/SessionState.h"
 
@@ -29,12 +30,15 @@ QString joined(QStringList parts) {
 
 QString borderText(const SessionState& state) {
     const QString& code = state.shemot.Bord;
+    const QString words = borderWords(state, code);
     if (code == u"NB"_s)
-        return state.wording(u"ללא מסגרת", u"no border");
+        return words;
     if (code == u"WB"_s)
         return state.wording(u"מסגרת לבנה", u"white border");
     if (code == u"BK"_s)
         return state.wording(u"מסגרת שחורה", u"black border");
+    if (!words.isEmpty())
+        return state.wording(u"מסגרת %1 (%2)", u"border %1 (%2)").arg(code, words);
     const bool isBorder = code != u"NN"_s && !told(code).isEmpty();
     return isBorder ? state.wording(u"מסגרת %1", u"border %1").arg(code) : QString();
 }
@@ -46,8 +50,8 @@ QString paperText(const SessionState& state) {
     const QString whole = state.shemot.FillFit == u"FIT"_s
                               ? state.wording(u"התמונה כולה, בלי חיתוך", u"the whole picture, uncut")
                               : QString();
-    return joined({size.isEmpty() ? size : state.wording(u"%1 ס\"מ", u"%1 cm").arg(size), told(state.shemot.maat),
-                   borderText(state), whole});
+    return joined({size.isEmpty() ? size : state.wording(u"%1 ס\"מ", u"%1 cm").arg(size),
+                   paperWord(state, told(state.shemot.maat)), borderText(state), whole});
 }
 
 QString albumText(const SessionState& state) {

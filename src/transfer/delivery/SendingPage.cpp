@@ -293,14 +293,23 @@ bool SendingPage::hasEnded() const {
 }
 
 BothLanguages SendingPage::whyItEnded() const {
-    if (!m_trouble)
-        return {QString::fromUtf16(look().title.hebrew), QString::fromUtf16(look().title.english)};
+    if (m_phase == SendingPhase::Refused && m_refusal)
+        return *m_refusal;
+    if (m_trouble)
+        return inBoth([this](const SessionState& reader) {
+            return LineTroubleText(reader, m_trouble->step, m_trouble->failure, m_trouble->subject);
+        });
+    const bool nothingToSend = m_phase == SendingPhase::NoOrder || m_phase == SendingPhase::NoServer;
+    const SendingWords& words = nothingToSend ? look().advice : look().title;
+    return {QString::fromUtf16(words.hebrew), QString::fromUtf16(words.english)};
+}
+
+BothLanguages SendingPage::inBoth(const std::function<QString(const SessionState&)>& words) const {
     SessionState reader = m_state;
-    const auto in = [&](std::int16_t language) {
-        reader.EnglishTips = language;
-        return LineTroubleText(reader, m_trouble->step, m_trouble->failure, m_trouble->subject);
-    };
-    return {in(0), in(1)};
+    reader.EnglishTips = 0;
+    const QString hebrew = words(reader);
+    reader.EnglishTips = 1;
+    return {hebrew, words(reader)};
 }
 
 bool SendingPage::isAtRest() const {
@@ -363,7 +372,11 @@ bool SendingPage::mayBeSent(const QStringList& paths) {
     const QStringList& damaged = counts.damagedFiles;
     if (!damaged.isEmpty())
         tellReason(LineStep::PrintCut, {Failure::Kind::Damaged, damaged.join(u", "_s)}, damaged.first());
-    return CompletenessGuard(m_state, m_platform).maySend(counts);
+    if (CompletenessGuard(m_state, m_platform).maySend(counts))
+        return true;
+    m_refusal =
+        inBoth([&](const SessionState& reader) { return CompletenessGuard(reader, m_platform).whatIsMissing(counts); });
+    return false;
 }
 
 bool SendingPage::prepareAgain(const OrderJournal& order, const PreparedAgain::IsTaken& isTaken) {

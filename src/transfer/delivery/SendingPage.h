@@ -13,6 +13,8 @@
 #include "transfer/delivery/SendingEvents.h"
 #include "transfer/delivery/SendingPhase.h"
 
+#include <functional>
+#include <optional>
 #include <span>
 
 namespace lumora {
@@ -51,7 +53,7 @@ public:
 
     // The page has come to an end, or waits for an answer.
     bool hasEnded() const;
-    // The reason that was told last; where none was, the title of the phase.
+    // Why, as the staff reads it: what the order lacks, or the reason that was told last, or the words of the phase.
     BothLanguages whyItEnded() const;
     // Nothing is left to do but to begin a new order, or to send again. Then the page may be left where nobody is
     // there.
@@ -127,6 +129,7 @@ protected:
 
 private:
     QString adviceOf(const PhaseLook& row) const;
+    BothLanguages inBoth(const std::function<QString(const SessionState&)>& words) const;
     bool goesOnByItself(SendingPhase phase) const;
     void showFacts();
     void showThanks();
@@ -164,6 +167,7 @@ private:
         QString subject;
     };
     std::optional<Trouble> m_trouble;
+    std::optional<BothLanguages> m_refusal; // what the order lacks that does not leave
 };
 
 } // namespace lumora

@@ -206,7 +206,7 @@ private:
     Ticker Timer4Line; // 1000 ms: the watch over the line
     FtpSender m_sender;
     QStringList m_handedOver; // paths from the page of finished orders
-    int m_fileCount = 0;      // files found in the folder
+    int m_fileCount = 0;      // of the order, as the sending counts them
     std::optional<int> m_printCount;
     std::optional<int> m_minutesLeft; // known from the second piece on
     bool m_incomplete = false;        // the pass has left files behind

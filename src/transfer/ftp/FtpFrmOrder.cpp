@@ -96,6 +96,7 @@ void FtpFrm::countPictures() {
     names.append(LeafNames(lists().List3.items()));
     m_state.shemot.TotalPics = sumOfCopies(names.items(), CopiesIn::FileNames);
     m_printCount = m_state.shemot.TotalPics;
+    m_fileCount = lists().List3.count();
     showCounts();
 }
 

@@ -182,7 +182,6 @@ void FtpFrm::setTexts() {
 }
 
 void FtpFrm::showFileCount(int files) {
-    m_fileCount = files;
     Label7.text = QString::number(files);
 }
 

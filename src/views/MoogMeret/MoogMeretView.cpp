@@ -121,7 +121,8 @@ QWidget* MoogMeretView::makeWays() {
                                        Item::room(),
                                        label(c.Label4Shalav3, "strong"),
                                        button(c.Command4, Role::Main, &MoogMeret::Command4_Click, u"send"_s),
-                                       button(c.Command2, Role::Secondary, &MoogMeret::Command2_Click, u"mail"_s)}));
+                                       button(c.Command2, Role::Secondary, &MoogMeret::Command2_Click, u"mail"_s),
+                                       label(c.Label4EinDoar, "smallMuted")}));
     ways->setFixedWidth(m_preview->width());
     follow(ways, c.waysPanel);
     return ways;
