@@ -24,6 +24,12 @@ void OrderResolution::look(const QString& path) {
     m_sizes[path] = size ? std::optional(*size) : std::nullopt;
 }
 
+std::optional<PictureSize> OrderResolution::sizeOf(const QString& path) {
+    if (!m_sizes.contains(path))
+        look(path);
+    return m_sizes.value(path);
+}
+
 std::optional<PrintResolution> OrderResolution::of(const QString& path, const QString& record) const {
     const std::optional<PictureSize> size = m_sizes.value(path);
     return size ? of(*size, record) : std::nullopt;
@@ -47,8 +53,7 @@ QStringList OrderResolution::coarse(const Basket& basket) {
     for (const QString& text : basket.lines().items()) {
         const BasketLine line = BasketLine::split(text, basket.form());
         const QString& path = line.path.text();
-        if (!m_sizes.contains(path))
-            look(path);
+        static_cast<void>(sizeOf(path));
         const std::optional<PrintResolution> resolution = of(path, line.editState);
         if (resolution && resolution->grade() == PrintResolution::Grade::Coarse)
             paths += path;

@@ -28,6 +28,8 @@ public:
 
     // Reads the header of the file, which may be another one under the same path than before.
     void look(const QString& path);
+    // Of the file as it was looked at last.
+    std::optional<PictureSize> sizeOf(const QString& path);
     // Of a picture that was looked at and can be read. record: its edit record, empty in a plain order.
     std::optional<PrintResolution> of(const QString& path, const QString& record) const;
     std::optional<PrintResolution> of(PictureSize picture, const QString& record) const;

@@ -143,6 +143,17 @@ void PictureChoice::chooseAll(const std::function<bool(const QString&)>& isUnrea
     }
 }
 
+void PictureChoice::changePaper(const OrderDetails& before, const PictureSizeOf& sizeOf) {
+    for (int i = 0; i < m_basket.count(); ++i) {
+        BasketLine line = BasketLine::split(m_basket.item(i), m_basket.form());
+        line.code = code(PrintCode::copiesOf(m_basket.item(i)), PaperWords::All).compose();
+        if (m_basket.form() == LineForm::Full)
+            line.editState = RecordOnPaper(line.editState, sizeOf(line.path.text()), before, m_state.shemot);
+        m_basket.replaceAt(i, line.compose(m_basket.form()));
+    }
+    markPage();
+}
+
 int PictureChoice::storeRecord(const QString& path, const QString& record) {
     const int index = m_basket.FindByPath(path);
     // The copies are those of the line, since another page may be in view by now.

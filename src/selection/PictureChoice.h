@@ -2,6 +2,7 @@
 
 #include "common/DrivePath.h"
 #include "selection/Basket.h"
+#include "selection/ChangedPaper.h"
 #include "selection/FolderPager.h"
 #include "selection/SeenPages.h"
 
@@ -70,6 +71,9 @@ public:
     void chooseAll(const std::function<bool(const QString&)>& isUnreadable = {});
     // The index of the line that has the record now, or -1 when the picture is not chosen.
     int storeRecord(const QString& path, const QString& record);
+    // The paper, its kind or the border of the order is another one than before: each line has its code and its record
+    // for it.
+    void changePaper(const OrderDetails& before, const PictureSizeOf& sizeOf);
     void removeDuplicates() { m_basket.removeDuplicates(); }
 
 private:

@@ -25,6 +25,7 @@ const std::vector<PageWay>& pageFlow() {
 
         {kyoskNew, EditorWanted, tFrmNew, Waits},
         {kyoskNew, TurnedWanted, Form3, Waits},
+        {kyoskNew, DetailsWanted, nnn, Waits},
         {kyoskNew, PlainChosen, Form2, IsLeft},
         {kyoskNew, EditedChosen, B3, IsLeft},
 

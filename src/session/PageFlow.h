@@ -35,6 +35,7 @@ enum class Outcome {
     EditedTakenUp,
     SendingTakenUpByFtp, // an unfinished sending goes on
     SendingTakenUpByHttp,
+    DetailsWanted, // size, paper or details are changed, and the pictures stay chosen
 };
 
 // One way through the program. A page that is left is unloaded; one that waits lies below the next.

@@ -65,7 +65,7 @@ TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
               QStringList({"פוטו גדול", "חום", "משי", "קנבס", "פינות עגולות=1"}));
     page.Command4Ivrit_Click();
     const AlbumControls& shown = page.album().controls();
-    EXPECT_EQ(page.controls().StepLine.text, u"שלב 7 מתוך 7");
+    EXPECT_DOUBLE_EQ(page.controls().stepShare, 6.0 / 7);
     EXPECT_EQ(shown.Pic4BilLines, (QStringList{"Studio Or", "Noa's wedding", "03-7654321", "studio@example.com",
                                                "פוטו גדול", "חום", "משי", "קנבס", "30/60"}));
     EXPECT_EQ(shown.Pic4BilExtras, (QStringList{"עוד=0", "הטבעת שם בכריכה=0", "פינות עגולות=1", "מזוודה=0",
@@ -123,6 +123,32 @@ TEST_F(AlbumTest, WhatIsMissingIsToldOnThePanelWhereItIsSetRight) {
     album.Command22_Click();
     EXPECT_EQ(chain.front()->id(), PageId::kyoskNew);
     EXPECT_EQ(state.album.SoogNiar + state.album.Tosafot1[0], u"בחר סוג נייר");
+}
+
+TEST_F(AlbumTest, CarefullyEachPanelAsksForWhatItNeedsBeforeItIsLeft) {
+    deployment.Careful = true;
+    nnn& page = start();
+    AlbumPanels& album = page.album();
+    const struct {
+        void (AlbumPanels::*leave)();
+        std::function<void()> fill;
+        Panel next;
+    } panels[] = {
+        {&AlbumPanels::Command17_Click, [&] { fillPhotographer(album); }, Panel::Kind},
+        {&AlbumPanels::Command16_Click, [&] { album.SoogAlb_Click(5); }, Panel::Size},
+        {&AlbumPanels::Command18_Click, [&] { album.Combo4Godel_Click(2); }, Panel::Cover},
+        {&AlbumPanels::Command19_Click, [&] { album.Combo4Cricha_Click(0); }, Panel::Paper},
+        {&AlbumPanels::Command20_Click, {}, Panel::Extras},
+    };
+    for (const auto& panel : panels) {
+        const Panel before = album.panel();
+        (album.*panel.leave)();
+        EXPECT_EQ(album.panel(), panel.fill ? before : panel.next);
+        if (panel.fill)
+            panel.fill(), (album.*panel.leave)();
+        EXPECT_EQ(album.panel(), panel.next);
+    }
+    EXPECT_EQ(machine.dialogs.messages.size(), 4);
 }
 
 TEST_F(AlbumTest, CopiesForTheParentsNeedAKindOfAlbumAndASize) {
@@ -194,6 +220,9 @@ TEST_F(AlbumTest, KindsAndCopiesFollowTheirButtons) {
     EXPECT_EQ(page.controls().Choice.text, u"פוטו הורים · 40/80 · קרם");
 
     // The next album begins with nothing chosen.
+    page.Command2_Click();
+    EXPECT_EQ(page.step(), nnn::Step::Album) << "the customer does not want to cancel";
+    machine.dialogs.answers = {true};
     page.Command2_Click();
     page.Image1_Click(albumTile);
     EXPECT_EQ(shown.Label17.text, u"***");

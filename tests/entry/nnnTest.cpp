@@ -35,7 +35,7 @@ TEST_F(nnnTest, APrintOrderGoesStepByStepToThePictures) {
     state.transfer.HazmanaP = 1;
     state.transfer.Mefurak = Travel::Pieces;
     page.Image1_Click(0);
-    EXPECT_EQ(shown.StepLine.text, u"שלב 1 מתוך 4");
+    EXPECT_EQ(shown.stepShare, 0);
     EXPECT_EQ(state.Optint, OrderKind::Print);
     EXPECT_EQ(state.shemot.ser, u"1234");
     EXPECT_EQ(state.shemot.TimeOfJob, u"2026_11_21_KUP_1234^");
@@ -124,6 +124,50 @@ TEST_F(nnnTest, AsksForBorderAndFitByKindOfOrderAndSwitches) {
             EXPECT_EQ(page.step(), back);
         }
         chain.unload(PageId::nnn);
+    }
+}
+
+TEST_F(nnnTest, ThePicturesLeadToWhatWasChosenAndBack) {
+    for (const bool cancels : {false, true}) {
+        LoadDefaultProfile(state, deployment);
+        chain.show(PageId::kyoskNew);
+        Page* pictures = chain.front();
+        state.Optint = OrderKind::Print;
+        OrderDetails& order = state.shemot;
+        order.n1 = u"Dana Levi"_s;
+        order.n2 = u"03-1"_s;
+        order.FillFit = u"FIT"_s;
+        order.Bord = u"WB"_s;
+        order.ppr = u"20/30"_s;
+        order.maat = u"Matte"_s;
+        order.TimeOfJob = u"2026_11_21_KUP_1234^"_s;
+        state.MisparHazmana = u"123"_s;
+        makeFolder(customerStore.folder());
+        write(customerStore, "of the customer");
+        ASSERT_TRUE(chain.follow(PageId::kyoskNew, Outcome::DetailsWanted));
+        auto& page = static_cast<nnn&>(*chain.front());
+        const nnnControls& shown = page.controls();
+        EXPECT_EQ(page.step(), nnn::Step::Options);
+        EXPECT_TRUE(shown.Combo1.text == u"20/30" && shown.Option3[0].checked && shown.Option4.checked);
+        EXPECT_EQ(shown.Picture16, 9);
+        page.Command4_Click();
+        EXPECT_EQ(shown.Text2.text + shown.Text3.text, u"Dana Levi03-1");
+        EXPECT_FALSE(shown.Command4.visible || shown.Check2.visible);
+        page.Text3_Change(u"03-2"_s);
+        page.Command12_Click();
+        page.Option1_Click(0);
+        page.Option3_Click(1);
+        page.Image13_MouseDown(0);
+        page.Command6_Click();
+        EXPECT_EQ(shown.Check1.visible, page.step() != nnn::Step::Terms) << "the terms were agreed to";
+        cancels ? page.Command2_Click() : page.Command3_Click();
+        ASSERT_EQ(chain.front(), pictures);
+        EXPECT_EQ(chain.find(PageId::nnn), nullptr);
+        EXPECT_EQ(QStringList({order.n2, order.ppr, order.maat, order.Bord, order.TimeOfJob, state.MisparHazmana}),
+                  QStringList({cancels ? "03-1" : "03-2", cancels ? "20/30" : "10/15", cancels ? "Matte" : "מבריק",
+                               cancels ? "WB" : "NB", "2026_11_21_KUP_1234^", "123"}));
+        EXPECT_EQ(read(customerStore), "of the customer");
+        chain.unload(PageId::kyoskNew);
     }
 }
 

@@ -145,6 +145,57 @@ TEST(AChoice, ofAPictureThatStandsInTwoCellsIsOneChoice) {
     EXPECT_TRUE(at.choice.chosen(0));
 }
 
+TEST(AChoice, ofAnotherPaperKeepsWhatIsSeenWhereItIs) {
+    const auto record = [](int panX, int panY, int textY, const QString& frame) {
+        EditFields edit;
+        UnpackEditState(EditRecord::newPicture(), edit);
+        edit.PanX = static_cast<std::int16_t>(panX);
+        edit.PanY = static_cast<std::int16_t>(panY);
+        edit.TextX = 40;
+        edit.TextY = static_cast<std::int16_t>(textY);
+        edit.FrameName = frame;
+        PackEditState(edit, u"NB"_s, {});
+        return edit.EditState;
+    };
+    const struct {
+        const char* what;
+        std::optional<PictureSize> picture;
+        QString ppr;
+        QString before; // border
+        QString now;
+        QString record;
+        QString after;
+    } cases[] = {
+        // The box of 10/15 is 450 by 300, or 300 by 450; that of 20/20 has equal sides.
+        {"lying", PictureSize{40, 30}, u"20/20"_s, u"NB"_s, u"NB"_s, record(225, 150, 100, u"000"_s),
+         record(225, 225, 150, u"000"_s)},
+        {"upright", PictureSize{30, 40}, u"20/20"_s, u"NB"_s, u"NB"_s, record(-10, 225, -90, u"A1"_s),
+         record(-10, 150, -60, u"A1"_s)},
+        {"at the ends", PictureSize{40, 30}, u"20/20"_s, u"NB"_s, u"NB"_s, record(0, 700, 900, u"000"_s),
+         record(0, 780, 999, u"000"_s)},
+        {"can't be read", std::nullopt, u"20/20"_s, u"NB"_s, u"NB"_s, record(225, 150, 100, u"000"_s),
+         record(225, 150, 100, u"000"_s)},
+        {"frame of the border", PictureSize{40, 30}, u"10/15"_s, u"WB"_s, u"NB"_s, record(5, 5, 5, u"001"_s),
+         record(5, 5, 5, u"000"_s)},
+        {"no edits", PictureSize{40, 30}, u"20/20"_s, u"WB"_s, u"NB"_s, EditRecord::newPicture(),
+         EditRecord::newPicture()},
+    };
+    for (const auto& each : cases) {
+        Choosing at(LineForm::Full);
+        at.order.Bord = each.before;
+        at.choice.choose(0, each.record);
+        at.choice.setCopies(0, 7);
+        const OrderDetails before = at.order;
+        at.order.ppr = each.ppr;
+        at.order.maat = u"Matte"_s;
+        at.order.Bord = each.now;
+        at.choice.changePaper(before, [&](const QString&) { return each.picture; });
+        const QString code = u"7 "_s + QString(each.ppr).remove(u'/') + u'M' + each.now;
+        EXPECT_EQ(at.lines(), QStringList(code + each.after + u"C:\\p\\01.jpg"_s)) << each.what;
+        EXPECT_EQ(at.choice.copies(0), 7);
+    }
+}
+
 TEST(AChoice, ofTheWholeFolderKeepsCopiesAndKnowsTheEnglishWordsCarefully) {
     struct Case {
         bool careful;

@@ -321,6 +321,46 @@ TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     EXPECT_EQ(state.edit.RotationCode, 180);
 }
 
+TEST_F(ThePictures, stayChosenOnAnotherPaper) {
+    for (const OrderKind kind : {OrderKind::Print, OrderKind::EditedPrint, OrderKind::Album}) {
+        chain.unload(PageId::kyoskNew);
+        chain.unload(PageId::tFrmNew);
+        state.Optint = kind;
+        state.shemot.ppr = u"10/15"_s;
+        registerBare({PageId::nnn});
+        const bool edited = kind == OrderKind::EditedPrint;
+        kyoskNew& page = openWith(2);
+        page.Picture1_Click(0);
+        if (edited) {
+            editor().Image15_Click();
+            editor().CommandDone_Click();
+            ASSERT_TRUE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))));
+        }
+        const QString line = page.controls().List1.item(0);
+        state.DchisaAmoka = 1;
+        page.changeDetails_Click();
+        if (kind == OrderKind::Album) {
+            EXPECT_EQ(chain.front(), &page) << "its size is none of the order's";
+            continue;
+        }
+        ASSERT_EQ(chain.front()->id(), PageId::nnn);
+        state.shemot.ppr = u"20/20"_s;
+        state.MediniyutDchisa = 1;
+        chain.follow(PageId::nnn, Outcome::PicturesWanted);
+        ASSERT_EQ(chain.front(), &page);
+        EXPECT_EQ(page.controls().List1.item(0).left(9), u"1 2020GNB"_s);
+        EXPECT_EQ(page.controls().Label15.text, u"20/20"_s);
+        EXPECT_EQ(state.DchisaAmoka, 0) << "what was answered was about another paper";
+        if (!edited)
+            continue;
+        EXPECT_EQ(field(page, 0, EditRecord::RotationCode), field(line, EditRecord::RotationCode));
+        EXPECT_FALSE(machine.files.fileExists(StoredSmallView::path(state, DrivePath(first))))
+            << "it has the old shape";
+        page.Picture1_Click(0);
+        EXPECT_EQ(editor().controls().PicPic.height(), editor().controls().PicPic.width());
+    }
+}
+
 TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     kyoskNew& page = openWith(2);
     page.Image7_Click();

@@ -35,7 +35,9 @@ TEST_P(PageLook, HasNoFaultFromThePicturesToTheSending) {
     go(walk, toDetails + toOptions + toBorder + toTerms + toPictures + u":10-no-pictures"_s);
     lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
-    go(walk, u"Picture1(0) Picture1(1) Picture1(4) Command12(1) :12-pictures Picture2>Form3 :12-upright Command1 "
+    go(walk, u"Picture1(0) Picture1(1) Picture1(4) Command12(1) :12-pictures changeDetails>nnn :12-change Command4 "
+             ":12-change-details Command12 Command8 Command6 :12-changed Command3>kyoskNew Picture2>Form3 :12-upright "
+             "Command1 "
              ":12-turned Command3>kyoskNew Image6 :13-help helpClose Image10 :14-leave Command4 Image7 :15-closing "
              "Text1=dana Command8 :15-domain-wanted ! :15-domain Command7>FtpFrm"_s);
     walk.settle(200);

@@ -91,6 +91,7 @@ class Order:
     def __init__(self):
         self.basket, self.whole, self.total, self.paper, self.choice, self.bill = {}, False, None, '', [], []
         self.details, self.closing, self.previews, self.withAddress, self.album = {}, {}, {}, False, False
+        self.before = None  # choice and details, while they are changed from the page of pictures
 
 
 class Walk:
@@ -106,7 +107,9 @@ class Walk:
         for line in self.lines:
             page, shown = line.get('page'), line.get('shown', {})
             if 'front' in line:
-                if line['front'] == 'kyoskNew' and line['before'] == 'nnn':
+                if line['front'] == 'nnn' and line['before'] == 'kyoskNew':
+                    order.before = order.choice, dict(order.details)
+                if line['front'] == 'kyoskNew' and line['before'] == 'nnn' and not order.before:
                     order.basket, order.previews, order.whole = {}, {}, False
                 if line['front'] in ('Form2', 'B3') and line['before'] == 'kyoskNew':
                     promise = copy.deepcopy(order.__dict__) | {'leftOut': ''}
@@ -127,6 +130,11 @@ class Walk:
                     order.details.pop('Text2', 0), order.details.pop('Text3', 0)
                 order.choice = next((plain(text).split(' · ') for text in line['words'] if ' · ' in text), order.choice)
             elif page == 'kyoskNew':
+                if order.before and line['act'] == 'press nnn.Command3':
+                    order.previews = {}  # on the paper before
+                elif order.before:
+                    order.choice, order.details = order.before
+                order.before = None
                 self.seePictures(order, line)
             elif page == 'tFrmNew' and 'Title' in shown:
                 order.previews[plain(shown['Title'])] = self.record / f'preview.{line["n"]}.png'

@@ -120,6 +120,8 @@ void AlbumPanels::leavePhotographer() {
         Q_EMIT focusWanted(u"Combo4Mail"_s);
         return;
     }
+    if (!isWhole())
+        return;
     if (Check5.checked) {
         const Result<void> saved =
             DetailStore(m_state, m_platform.files).SaveAlbumDetails({Text1[0].text, Text1[1].text, Text1[3].text});
@@ -207,7 +209,7 @@ void AlbumPanels::leaveKind() {
         if (row.list.rows.isEmpty())
             row.list.fill(itemsOf(row.choice), promptOf(row.choice));
     }
-    open(Panel::Size);
+    goOnTo(Panel::Size);
 }
 
 // --- size, cover, paper, extras ---
@@ -262,26 +264,62 @@ QString AlbumPanels::mailAddress() const {
     return typed.untouched && typed.name.contains(u'@') ? typed.name : MailAddressGuard(m_state).address(typed);
 }
 
-// Opens the panel on which the photographer sets the fault right.
-void AlbumPanels::refuse(const AlbumProblem& problem) {
-    using Place = AlbumProblem::Place;
-    static const struct {
-        Place place;
-        Panel panel;
-        QString control;
-    } ways[] = {
-        {Place::Name, Panel::Photographer, u"Text1(0)"_s},  {Place::Telephone, Panel::Photographer, u"Text1(1)"_s},
-        {Place::Event, Panel::Photographer, u"Text1(2)"_s}, {Place::Mail, Panel::Photographer, u"Text1(3)"_s},
-        {Place::Kind, Panel::Kind, u"SoogAlb(0)"_s},        {Place::Size, Panel::Size, u"Combo4Godel"_s},
-        {Place::Cover, Panel::Cover, u"Combo4Cricha"_s},    {Place::Paper, Panel::Paper, u"Combo4Niyar"_s},
-    };
-    m_platform.dialogs.message(problem.message);
-    for (const auto& way : ways) {
-        if (way.place != problem.place)
-            continue;
-        open(way.panel);
-        Q_EMIT focusWanted(way.control);
+struct AlbumPanels::FaultRow {
+    Panel panel;
+    QString control;
+};
+
+// Where the photographer sets the fault right.
+AlbumPanels::FaultRow AlbumPanels::placeOf(const AlbumProblem& problem) {
+    using enum AlbumProblem::Place;
+    switch (problem.place) {
+    case Name:
+        return {Panel::Photographer, u"Text1(0)"_s};
+    case Telephone:
+        return {Panel::Photographer, u"Text1(1)"_s};
+    case Event:
+        return {Panel::Photographer, u"Text1(2)"_s};
+    case Mail:
+        return {Panel::Photographer, u"Text1(3)"_s};
+    case Kind:
+        return {Panel::Kind, u"SoogAlb(0)"_s};
+    case Size:
+        return {Panel::Size, u"Combo4Godel"_s};
+    case Cover:
+        return {Panel::Cover, u"Combo4Cricha"_s};
+    case Paper:
+        return {Panel::Paper, u"Combo4Niyar"_s};
     }
+    return {Panel::Photographer, {}};
+}
+
+void AlbumPanels::refuse(const AlbumProblem& problem) {
+    const FaultRow place = placeOf(problem);
+    m_platform.dialogs.message(problem.message);
+    open(place.panel);
+    Q_EMIT focusWanted(place.control);
+}
+
+bool AlbumPanels::isBegun() const {
+    return m_panel != Panel::Photographer ||
+           std::ranges::any_of(Text1, [](const Caption& box) { return !box.text.trimmed().isEmpty(); });
+}
+
+// The check goes from panel to panel, so that its first fault is the open panel's unless that one is whole.
+bool AlbumPanels::isWhole() {
+    if (!m_state.Careful)
+        return true;
+    gather();
+    const std::optional<AlbumProblem> problem = CheckAlbum(m_state, Text1[3].text);
+    if (!problem || placeOf(*problem).panel > m_panel)
+        return true;
+    refuse(*problem);
+    return false;
+}
+
+void AlbumPanels::goOnTo(Panel next) {
+    if (isWhole())
+        open(next);
 }
 
 // --- the panels themselves ---

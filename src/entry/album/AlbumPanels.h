@@ -32,6 +32,8 @@ public:
     // One panel back; false on the first.
     bool back();
     void setTexts();
+    // Something was typed or chosen that a cancel would throw away.
+    bool isBegun() const;
 
     // --- events ---
 
@@ -48,11 +50,11 @@ public:
     void Combo4Horim_Click(int row) { takeParentSize(row); }
     void Command16_Click() { leaveKind(); }
     void Combo4Godel_Click(int row) { take(Combo4Godel, row); }
-    void Command18_Click() { open(Panel::Cover); }
+    void Command18_Click() { goOnTo(Panel::Cover); }
     void Combo4Cricha_Click(int row) { take(Combo4Cricha, row); }
-    void Command19_Click() { open(Panel::Paper); }
+    void Command19_Click() { goOnTo(Panel::Paper); }
     void Combo4Niyar_Click(int row) { take(Combo4Niyar, row); }
-    void Command20_Click() { open(Panel::Extras); }
+    void Command20_Click() { goOnTo(Panel::Extras); }
     void Combo4Tosefet_Click(int row) { take(Combo4Tosefet, row); }
     void Check3_Click(int extra, bool checked) { tick(Check3.at(static_cast<std::size_t>(extra)), checked); }
     void Command21_Click() { goOnToBill(); }
@@ -87,6 +89,9 @@ private:
     std::vector<ListRow> listTable();
 
     void open(Panel next);
+    // Carefully what the open panel has to have is asked for before it is left.
+    bool isWhole();
+    void goOnTo(Panel next);
     void showPanel();
     QString choiceSoFar() const;
 
@@ -109,6 +114,8 @@ private:
     void gather();
     void writeBill();
     void finish();
+    struct FaultRow;
+    static FaultRow placeOf(const AlbumProblem& problem);
     void refuse(const AlbumProblem& problem);
     void slide(int& shift, Ticker& timer);
     void stopSliding();

@@ -55,6 +55,8 @@ void nnn::load() {
     m_state.shemot.Girsa = u"4.00"_s;
     fillSizes();
     setTexts();
+    if (m_chain.find(PageId::kyoskNew))
+        beginChange();
 }
 
 // --- the menu ---
@@ -222,6 +224,8 @@ void nnn::leaveDetails() {
     if (!telephoneMayBe())
         return;
     open(Step::Options);
+    if (isChanging())
+        return;
     // The order goes on even if the details can't be stored.
     succeeded(RememberedDetails(m_state, m_platform.files).typed({Text2.text, Text3.text}, Check2.checked));
 }
@@ -326,13 +330,15 @@ void nnn::closeTermsHint() {
 }
 
 void nnn::finishPrints() {
-    if (m_leaving || !termsAgreed(Check1))
+    if (m_leaving || !(isChanging() || termsAgreed(Check1)))
         return;
     takeDetails(m_state.shemot, Text2.text, Text3.text, Text4.text);
     if (const std::optional<DetailsProblem> problem = CheckDetails(m_state)) {
         refuse(*problem);
         return;
     }
+    if (isChanging())
+        return leaveChange();
     rememberOrForget();
     if (m_state.Optint >= OrderKind::Print && m_state.Optint <= OrderKind::Sequence)
         GoToSelection();
@@ -409,6 +415,10 @@ void nnn::GoToSelection() {
 // --- ways back ---
 
 void nnn::cancel() {
+    if (m_leaving || (m_step == Step::Album && !asksToCancelAlbum()))
+        return;
+    if (isChanging())
+        return cancelChange();
     Command12.enabled = true;
     Frame1.visible = false;
     markedTile = -1;

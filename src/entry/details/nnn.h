@@ -6,6 +6,7 @@
 #include "entry/details/nnnControls.h"
 #include "platform/Platform.h"
 #include "session/Page.h"
+#include "session/SessionState.h"
 
 #include <optional>
 
@@ -13,7 +14,6 @@ namespace lumora {
 
 class PageChain;
 struct HistoryState;
-struct SessionState;
 
 // nnn, "details of the order" in the glossary: the customer takes the kind of order from a menu and then, step by step,
 // gives name, paper, border and fit and agrees to the terms, up to the choice of pictures.
@@ -81,6 +81,14 @@ public:
     const Focus& focus() const { return m_focus; }
 
 private:
+    // The page was opened by the page of pictures.
+    bool isChanging() const { return m_before.has_value(); }
+    void beginChange();
+    void showChange();
+    void leaveChange();
+    void cancelChange();
+    bool asksToCancelAlbum();
+
     struct StepRow;
     std::vector<StepRow> stepTable();
 
@@ -147,6 +155,12 @@ private:
     PageChain& m_chain;
     AlbumPanels m_album;
     Step m_step = Step::Menu;
+    // What the order had when the page was opened by the page of pictures.
+    struct Before {
+        OrderDetails details;
+        CouponState coupon;
+    };
+    std::optional<Before> m_before;
     Focus m_focus;
     std::array<QString, 3> m_quickSizes; // of Option1; an empty one is not on offer
     QString VolumeSerial;

@@ -7,7 +7,7 @@ namespace lumora {
 // What the details page shows, but for the panels of an album.
 struct nnnControls : Controls {
     Caption Title{*this, u"Title"};         // what the open step asks for
-    Caption StepLine{*this, u"StepLine"};   // "step 2 of 5"; hidden in the menu
+    double stepShare = 0;                   // of the steps of the page, those that are done: 0 to 1
     Caption Choice{*this, u"Choice"};       // size, kind, border and fit, as far as chosen
     Caption Label4Tel{*this, u"Label4Tel"}; // the lab's telephone, for a question
     Caption Command2{*this, u"Command2"};   // cancel

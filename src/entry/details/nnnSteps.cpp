@@ -79,6 +79,8 @@ void nnn::goBack() {
         if (row.step < m_step && row.asked)
             before = row.step;
     }
+    if (before == Step::Menu && isChanging())
+        return cancel();
     open(before);
 }
 
@@ -113,6 +115,8 @@ void nnn::showStep() {
     LabelTerms.visible = Command30.visible = m_step == Step::Terms && m_termsHint;
     Label4Tel.text = m_state.profile.LabPhone;
     showProgress(table);
+    if (isChanging())
+        showChange();
     Q_EMIT changed();
 }
 
@@ -123,10 +127,9 @@ void nnn::showProgress(const std::vector<StepRow>& table) {
         return std::count_if(table.begin(), table.end(),
                              [&](const StepRow& row) { return row.asked && row.step <= last; });
     };
-    StepLine.visible = m_step != Step::Menu;
-    StepLine.text = m_state.wording(u"שלב %1 מתוך %2", u"Step %1 of %2")
-                        .arg(ofAlbum ? 1 + static_cast<int>(m_album.panel()) : asked(m_step))
-                        .arg(ofAlbum ? AlbumPanels::panelCount : asked(Step::Terms));
+    const auto done = ofAlbum ? static_cast<long>(m_album.panel()) : asked(m_step) - 1;
+    const auto all = ofAlbum ? static_cast<long>(AlbumPanels::panelCount) : asked(Step::Terms);
+    stepShare = m_step == Step::Menu ? 0 : static_cast<double>(done) / static_cast<double>(std::max(all, 1L));
     const StepRow& row = table[static_cast<std::size_t>(m_step)];
     Title.text = ofAlbum ? album.Pic4Alboom.text.trimmed() : m_state.wording(row.hebrew, row.english);
     Choice.text = ofAlbum ? album.ChoiceSoFar.text : choiceSoFar();

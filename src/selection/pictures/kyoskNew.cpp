@@ -34,7 +34,12 @@ kyoskNew::kyoskNew(SessionState& state, const Platform& platform, PageChain& cha
     , File1(platform.files, picturePatterns(state.door.everyFormat),
             state.door.any() ? FileList::Names::Stored : FileList::Names::InCodePage)
     , Timer1(40, [this] { moveLabel35(); })
-    , Timer2(500, [this] { movePointers(); }) {}
+    , Timer2(500, [this] { movePointers(); }) {
+    connect(&chain, &PageChain::shown, this, [this](const Page* page) {
+        if (page == this && m_before)
+            takeChanges();
+    });
+}
 
 // Nothing leads any more to what was made for an order that was not handed over.
 kyoskNew::~kyoskNew() {
@@ -52,10 +57,7 @@ AddressBox kyoskNew::addressBox() const {
 }
 
 void kyoskNew::load() {
-    // Nothing stays of the last picture of an earlier order.
-    UnpackEditState(EditRecord::newPicture(), m_state.edit);
-    m_state.edit.PicturePath = {};
-    m_state.edit.EditState = EditRecord::beforeAnyPicture();
+    forgetEditing(); // nothing stays of the last picture of an earlier order
     m_choice.setForm(lineFormOf(m_state.Optint));
     decideCompression();
 
@@ -79,14 +81,8 @@ void kyoskNew::load() {
         m_state.BranchChoice.clear();
     watchCards();
     showChoice();
-    if (plain())
-        return;
-    // This page makes the editor once for each order.
-    m_chain.load<tFrmNew>();
-    connect(&editor(), &tFrmNew::stored, this, &kyoskNew::storeRecord);
-    connect(&editor(), &tFrmNew::storedMeanwhile, this, &kyoskNew::putRecord);
-    connect(&editor(), &tFrmNew::left, this, &kyoskNew::leaveEditor);
-    connect(&editor(), &tFrmNew::picked, this, &kyoskNew::showFolderOf);
+    if (!plain())
+        makeEditor();
 }
 
 // Address, note and branch are those that were chosen before.

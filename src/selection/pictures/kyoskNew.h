@@ -4,6 +4,7 @@
 #include "platform/files/Files.h"
 #include "platform/media/Cards.h"
 #include "selection/CardCopies.h"
+#include "selection/ChangedPaper.h"
 #include "selection/FinishRule.h"
 #include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
@@ -26,6 +27,7 @@ class PageChain;
 class PictureDoor;
 struct Platform;
 struct HandOver;
+struct OrderDetails;
 struct SessionState;
 class tFrmNew;
 
@@ -77,6 +79,9 @@ public:
     // The editor.
     void Command5_Click() { storeSmallView(); }
     void ZZvvA_Click() { storeRecord(); }
+
+    // Size, paper and details.
+    void changeDetails_Click() { openDetails(); }
 
     // Leaving.
     void Image10_Click() { askToLeave(); }
@@ -210,6 +215,14 @@ private:
     QString unreadableText(const QString& path) const;
     DrivePath shownPath(const QString& path) const;
 
+    void openDetails();
+    bool mayChangeDetails() const;
+    void takeChanges();
+    void beginEditorAnew();
+    void makeEditor();
+    void unloadEditor();
+    void forgetEditing();
+
     tFrmNew& editor() const;
     void leaveEditor();
     void storeSmallView();
@@ -270,13 +283,14 @@ private:
     int m_cellSize = 115;   // logical pixels
     int m_cellPixels = 115; // of this screen
     int m_openCell = -1;
-    int m_rotation = 0;         // of the large view: 0, 90, 180, 270
-    unsigned m_drawing = 0;     // the number of the latest redraw
-    DrivePath m_largePath;      // the picture of the large view, which Image4 turns
-    bool m_countShown = false;  // a folder was picked, and its pictures were counted
-    bool m_picking = false;     // the file dialog is open
-    bool m_promptStands = true; // Combo1 shows its prompt
-    bool m_tookBack = false;    // the order was prepared before, and came back
+    int m_rotation = 0;                     // of the large view: 0, 90, 180, 270
+    unsigned m_drawing = 0;                 // the number of the latest redraw
+    DrivePath m_largePath;                  // the picture of the large view, which Image4 turns
+    bool m_countShown = false;              // a folder was picked, and its pictures were counted
+    bool m_picking = false;                 // the file dialog is open
+    bool m_promptStands = true;             // Combo1 shows its prompt
+    std::unique_ptr<OrderDetails> m_before; // while the page of details changes them
+    bool m_tookBack = false;                // the order was prepared before, and came back
     bool m_handedOver = false;
     bool m_handOverFailed = false; // told once, and not at each touch
     Guide m_guide = Guide::None;

@@ -62,6 +62,7 @@ struct kyoskNewControls : Controls {
     Caption Label7Prompt{*this, u"Label7Prompt"};
     Caption Label15{*this, u"Label15"}; // paper size
     Caption Label18{*this, u"Label18"};
+    Caption changeDetails{*this, u"changeDetails"};          // size, paper and details
     Caption Label24{*this, u"Label24", Caption::At::Hidden}; // the edit record as it is, for the operator
     Caption Label25{*this, u"Label25"};                      // reminder of the folder choice
     Caption Label29{*this, u"Label29"};                      // the folder picked last

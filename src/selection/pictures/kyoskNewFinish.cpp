@@ -255,8 +255,7 @@ void kyoskNew::handOver(const QString& mail) {
     m_state.handOver.pressStart = plain();
     m_chain.follow(pageId, plain() ? Outcome::PlainChosen : Outcome::EditedChosen);
     // The next order begins with an editor of its own.
-    for (const PageId id : {PageId::mikledet, PageId::RedI, PageId::Form3, PageId::tFrmNew, PageId::BigPics})
-        m_chain.unload(id);
+    unloadEditor();
 }
 
 } // namespace lumora

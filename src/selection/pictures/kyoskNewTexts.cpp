@@ -25,6 +25,7 @@ void kyoskNew::setTexts() {
 
 void kyoskNew::setBrowserTexts() {
     Label15.text = Label18.text = m_state.shemot.ppr;
+    changeDetails.visible = mayChangeDetails();
     if (plain())
         setCaptions(m_state, {{Title, u"בחירת תמונות", u"Choose your pictures"}});
     else
@@ -52,6 +53,7 @@ void kyoskNew::setBrowserTexts() {
             {Image15, u"הקודמות", u"Previous", u"תמונות קודמות", u"Previous pictures"},
             {Image16, u"הבאות", u"Next", u"תמונות הבאות", u"Next pictures"},
             {Image17, u"מחירון", u"Price list"},
+            {changeDetails, u"שינוי", u"Change"},
             {Image23, u"סגור את התוכנה", u"End the program"},
             {Command11, u"הסר כפילויות", u"Drop duplicates", u"תמונה שנבחרה פעמיים תופיע פעם אחת",
              u"A picture that stands twice in the basket will stand once"},

@@ -172,8 +172,9 @@ void kyoskNewView::makeBars() {
                               button(c.Image10, Role::Quiet, &kyoskNew::Image10_Click, u"exit"_s)});
     frame().addSecondaryActions({button(c.Image5, Role::Secondary, &kyoskNew::Image5_Click, u"folder-plus"_s),
                                  button(c.Image8, Role::Quiet, &kyoskNew::Image8_Click, u"eraser"_s)});
-    frame().addStatus(
-        {lineLabel(c.Label7Prompt), lineLabel(c.Label7, "title"), Space::Tight, lineLabel(c.Label15, "muted")});
+    QPushButton* change = button(c.changeDetails, Role::Quiet, &kyoskNew::changeDetails_Click);
+    frame().addStatus({lineLabel(c.Label7Prompt), lineLabel(c.Label7, "title"), Space::Tight,
+                       inRow(Space::None, {lineLabel(c.Label15, "muted"), change})});
     frame().addMainActions({button(c.Image13, Role::Main, &kyoskNew::Image13_Click),
                             button(c.Image7, Role::Main, &kyoskNew::Image7_Click)});
 }

@@ -183,6 +183,7 @@ QWidget* nnnView::makeTerms() {
     add(*summary.column, {label(c.LabelChoice, "muted"), m_chosen});
     const Card terms = makeCard("card", Pad::Wide);
     terms.frame->setMinimumWidth(theme().size(Extent::Form));
+    follow(terms.frame, c.Check1);
     QLayout* row = inRow(Space::Normal, {checkBox(c.Check1, toPage(&nnn::Check1_Click)), Item::room(),
                                          button(c.Command29, Role::Plain, &nnn::Command29_Click, u"document"_s)});
     const Card hint = makeCard("notice", Pad::Slim);
@@ -248,7 +249,8 @@ bool nnnView::leave() {
 }
 
 void nnnView::render() {
-    frame().setTitle(c.Title.text, c.StepLine.visible ? c.StepLine.text : QString());
+    frame().setTitle(c.Title.text);
+    frame().steps().setStep(OrderStep::Details, c.stepShare);
     for (std::size_t i = 0; i < m_tiles.size(); ++i) {
         if (!m_tiles[i])
             continue;

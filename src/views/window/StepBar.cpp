@@ -21,8 +21,9 @@ void StepBar::setTexts(const QStringList& names, const QString& spokenPrefix) {
     update();
 }
 
-void StepBar::setStep(OrderStep step) {
+void StepBar::setStep(OrderStep step, double share) {
     m_step = step;
+    m_share = share;
     speak();
     update();
 }
@@ -60,7 +61,13 @@ void StepBar::paintEvent(QPaintEvent*) {
         const QPointF a = centre(i);
         const QPointF b = centre(i + 1);
         const double inset = (b.x() > a.x() ? 1 : -1) * (radius + m_theme.size(Space::Small));
-        painter.drawLine(QPointF(a.x() + inset, y), QPointF(b.x() - inset, y));
+        const QPointF from(a.x() + inset, y);
+        const QPointF to(b.x() - inset, y);
+        painter.drawLine(from, to);
+        if (i == current && m_share > 0) {
+            painter.setPen(QPen(Theme::Colour::Primary, m_theme.thick(), Qt::SolidLine, Qt::RoundCap));
+            painter.drawLine(from, from + (to - from) * m_share);
+        }
     }
     for (int i = 0; i < count; ++i) {
         const bool done = i < current;

@@ -16,7 +16,8 @@ public:
     StepBar(const Theme& theme, QWidget* parent);
 
     void setTexts(const QStringList& names, const QString& spokenPrefix);
-    void setStep(OrderStep step);
+    // share: how far the step itself is done, 0 to 1.
+    void setStep(OrderStep step, double share = 0);
 
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
@@ -31,6 +32,7 @@ private:
     QStringList m_names;
     QString m_spokenPrefix;
     OrderStep m_step = OrderStep::Start;
+    double m_share = 0;
 };
 
 } // namespace lumora
