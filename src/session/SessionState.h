@@ -176,6 +176,9 @@ enum class Sender : std::int16_t { Ftp = 0, Http = 1 };
 // Whose name and telephone the tail of an album's print files carries.
 enum class AlbumTail : std::int16_t { Customer, Photographer };
 
+// For which presses of a field the keyboard on the screen rises.
+enum class ScreenKeys : std::int16_t { Never, Touches, Always };
+
 enum class Sending : std::int16_t { NewOrder = 0, Resend = 1, Chain = 2 };
 
 // In which form the files of an order travel.
@@ -260,7 +263,8 @@ struct SessionState {
     bool offerPutOff = false; // the customer has put off the unfinished orders for this run
     bool OperatorArea = true; // a customer may open the hidden area of the sending page
     bool Waiting = false;     // orders that did not arrive are sent by themselves while nobody is at the start page
-    int waitingOrders = 0;    // how many there are, as the start page counted them last
+    ScreenKeys screenKeys = ScreenKeys::Never;
+    int waitingOrders = 0; // how many there are, as the start page counted them last
 
     ClientProfile profile;
     OrderDetails shemot;

@@ -1,6 +1,7 @@
 #include "order/EditRecord.h"
 #include "selection/Basket.h"
 #include "selection/CardWords.h"
+#include "selection/CopiesEntry.h"
 #include "selection/FolderPager.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
@@ -255,6 +256,24 @@ TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
         EXPECT_EQ(at.choice.path(0), u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
         EXPECT_EQ(at.choice.page().count(), c.count) << c.careful << c.presses;
         EXPECT_EQ(at.choice.hasNextPage(), !c.careful || at.choice.path(c.count - 1) != u"C:\\p\\40.jpg"_s);
+    }
+}
+
+TEST(Copies, areTypedOnDigitsUpTo99AndGoWith0) {
+    const struct {
+        int before;
+        QString keys, shown; // < takes back
+    } cases[] = {{1, u""_s, u"1"_s},     {1, u"7"_s, u"7"_s}, {3, u"12"_s, u"12"_s}, {3, u"123"_s, u"12"_s},
+                 {1, u"99"_s, u"99"_s},  {5, u"0"_s, u"0"_s}, {5, u"07"_s, u"7"_s},  {12, u"<"_s, u"1"_s},
+                 {12, u"<5"_s, u"15"_s}, {5, u"<"_s, u""_s},  {5, u"<<8"_s, u"8"_s}};
+    for (const auto& one : cases) {
+        CopiesEntry entry;
+        entry.begin(one.before);
+        for (const QChar key : one.keys)
+            key == u'<' ? entry.takeBack() : entry.type(key.digitValue());
+        EXPECT_EQ(entry.text(), one.shown) << qPrintable(one.keys);
+        EXPECT_EQ(entry.copies(), one.shown.isEmpty() ? std::nullopt : std::optional(one.shown.toInt()));
+        EXPECT_EQ(entry.removes(), one.shown == u"0"_s);
     }
 }
 

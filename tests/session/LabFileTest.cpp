@@ -39,7 +39,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
-              "[Operator]\nArea = no\nEditor = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting = yes\n"
+              "[Operator]\nArea = no\nEditor = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting = yes\nKeyboard = Auto\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -58,7 +58,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_TRUE(lab.SugTzad == 60 && lab.ftpType == FtpType::Image && lab.HaKoopon == 1 && lab.MinuyPaar == 2);
     EXPECT_TRUE(lab.Waiting && state.Waiting && lab.watchedCards && lab.keptFtpSession && !lab.DchisatAlbum &&
                 lab.SplitPage && lab.FitMuzag && lab.DoarReshut && lab.TachanaMekomit && !lab.OperatorArea &&
-                lab.OperatorEditor);
+                lab.OperatorEditor && state.screenKeys == ScreenKeys::Touches);
     EXPECT_TRUE(lab.GvulMuzag == 0 && lab.TmunatPaar == 1 && profile.ReportOn == 0 && lab.MediniyutDchisa == 1);
     const MailAccount& mail = lab.profile.mail;
     EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
@@ -149,6 +149,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     expected.OperatorArea = false;
     expected.profile.PriceListUrl = u"http://www.lumora.example/album_pricelist"_s; // else it follows the site
     expected.albumTail = AlbumTail::Photographer;
+    expected.screenKeys = ScreenKeys::Touches;
     EXPECT_TRUE(example.deployment == expected);
     SessionState session;
     LoadDefaultProfile(session, example.deployment);

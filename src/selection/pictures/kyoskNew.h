@@ -5,6 +5,7 @@
 #include "platform/media/Cards.h"
 #include "selection/CardCopies.h"
 #include "selection/ChangedPaper.h"
+#include "selection/CopiesEntry.h"
 #include "selection/FinishRule.h"
 #include "selection/OrderResolution.h"
 #include "selection/PictureChoice.h"
@@ -57,6 +58,13 @@ public:
     void Picture1_Click(int cell) { choosePicture(cell); }
     void Command12_Click(int cell) { addCopies(cell, 1); }
     void Command13_Click(int cell) { addCopies(cell, -1); }
+
+    // The number of copies of a chosen picture opens digits, where the lab has keys on the screen.
+    void Label4_Click(int cell) { askCopies(cell); }
+    void copiesDigit_Click(int digit) { typeCopies(digit); }
+    void copiesBack_Click() { takeBackDigit(); }
+    void copiesCancel_Click() { closeEntry(); }
+    void copiesDone_Click() { takeEntry(); }
 
     // Finding pictures.
     void Image5_Click() { addFolder(); }
@@ -125,6 +133,7 @@ public:
     int openCell() const { return m_openCell; }
     // A folder was picked or a picture chosen: the cells replace the first step.
     bool showsCells() const { return !List4.isEmpty() || !List1.isEmpty(); }
+    bool typesCopies() const;
     // The box of the closing panel that takes the address.
     AddressBox addressBox() const;
     // The box that takes the keyboard next; a view moves the focus when the number has changed.
@@ -191,6 +200,12 @@ private:
     void takeIntoEditor(const QString& path);
     void addCopies(int cell, int more);
     void setCopies(int cell, int copies);
+    void askCopies(int cell);
+    void typeCopies(int digit);
+    void takeBackDigit();
+    void showEntry();
+    void closeEntry();
+    void takeEntry();
     void beginWithoutEdits(const DrivePath& picture);
     void cancelPage();
     void chooseWholeFolder();
@@ -268,6 +283,9 @@ private:
     DoorWait m_wait;
     void (kyoskNew::*m_onceMade)() = &kyoskNew::openFinish;
     PictureChoice m_choice;
+    CopiesEntry m_copiesEntry;
+    int m_countedCell = 0; // whose copies are typed
+    QString m_countedPath;
     OrderResolution m_resolution;
     SmallPictures m_small;
     FileList File1;

@@ -50,6 +50,16 @@ struct kyoskNewControls : Controls {
     ControlArray<SpokenCaption, cellsOfPage> Command12{*this, u"Command12"}; // plus
     ControlArray<SpokenCaption, cellsOfPage> Command13{*this, u"Command13"}; // minus
 
+    Caption copiesPanel{*this, u"copiesPanel", Caption::At::Hidden}; // the copies are typed on digits
+    Bitmap copiesPicture;
+    Caption copiesHead{*this, u"copiesHead"};
+    Caption copiesTyped{*this, u"copiesTyped"};
+    Caption copiesNote{*this, u"copiesNote"};
+    ControlArray<Caption, 10> copiesDigit{*this, u"copiesDigit"};
+    Caption copiesBack{*this, u"copiesBack"};
+    Caption copiesCancel{*this, u"copiesCancel"};
+    Caption copiesDone{*this, u"copiesDone"};
+
     Caption Title{*this, u"Title"};   // what to do on this page
     Caption Frame1{*this, u"Frame1"}; // the frame of the cells; text: what to do while there are none
     LargeView Picture2{*this, u"Picture2"};

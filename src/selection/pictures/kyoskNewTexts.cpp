@@ -58,6 +58,10 @@ void kyoskNew::setBrowserTexts() {
             {Command11, u"הסר כפילויות", u"Drop duplicates", u"תמונה שנבחרה פעמיים תופיע פעם אחת",
              u"A picture that stands twice in the basket will stand once"},
             {Command14, u"הצג רק מה שנבחר", u"Show only what was chosen"},
+            {copiesHead, u"כמה עותקים?", u"How many copies?"},
+            {copiesBack, u"", u"", u"מחק ספרה", u"Take back a digit"},
+            {copiesCancel, u"ביטול", u"Cancel"},
+            {copiesDone, u"אישור", u"OK"},
             {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
             {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
             {doorNote, u"מכינים את התמונות שבחרת", u"Making your pictures ready"},
@@ -77,6 +81,9 @@ void kyoskNew::setBrowserTexts() {
         setCaptions(m_state, {{plus, u"+", u"+", u"עותק נוסף", u"One copy more"}});
     for (SpokenCaption& minus : Command13)
         setCaptions(m_state, {{minus, u"−", u"−", u"עותק פחות, או ביטול הבחירה", u"One copy less, or not at all"}});
+    for (std::size_t digit = 0; digit < copiesDigit.size(); ++digit)
+        copiesDigit[digit].text = QString::number(digit);
+    showEntry();
     Picture2.warning =
         m_state.wording(u"מעט פיקסלים: ההדפסה עלולה לצאת מטושטשת", u"Few pixels: the print may come out blurred");
     Picture2.spoken = m_state.wording(u"הצגת התמונה בגדול", u"Look at the picture in large");

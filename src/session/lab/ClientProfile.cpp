@@ -51,6 +51,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.door = deployment.door;
     state.OperatorArea = deployment.OperatorArea;
     state.Waiting = deployment.Waiting;
+    state.screenKeys = deployment.screenKeys;
     state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;

@@ -35,6 +35,7 @@ struct Deployment {
     bool OperatorArea = true;
     bool OperatorEditor = false;
     bool Waiting = false; // orders that did not arrive are sent by themselves while nobody is at the start page
+    ScreenKeys screenKeys = ScreenKeys::Never;
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;
 

@@ -249,6 +249,10 @@ std::vector<Row> rows() {
         {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},
 
         {"Kiosk", "Waiting", yesNo(at(&D::Waiting), true, false)},
+        {"Kiosk", "Keyboard",
+         words<ScreenKeys>(
+             at(&D::screenKeys), u"never, auto or always"_s,
+             {{u"never"_s, ScreenKeys::Never}, {u"auto"_s, ScreenKeys::Touches}, {u"always"_s, ScreenKeys::Always}})},
 
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",

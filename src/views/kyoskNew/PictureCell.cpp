@@ -26,10 +26,18 @@ PictureCell::PictureCell(const Theme& theme, QWidget* parent)
     };
     m_minus = key(u"minus"_s);
     m_plus = key(u"plus"_s);
-    m_copies = centred(make.oneLine("large"));
+    m_copies = make.plainButton({}, "count", [] {});
+    m_copies->setFocusPolicy(Qt::NoFocus);
+    m_copies->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    m_copies->setFixedHeight(theme.key());
+    setCopiesTyped(false);
     // Minus is left of plus in both languages.
     m_strip = make.leftToRight(make.inRow(Space::None, {m_minus, {m_copies, 1}, m_plus}));
     m_strip->hide();
+}
+
+void PictureCell::setCopiesTyped(bool typed) {
+    m_copies->setAttribute(Qt::WA_TransparentForMouseEvents, !typed);
 }
 
 void PictureCell::show(const Look& look) {

@@ -3,7 +3,6 @@
 #include "editing/ResolutionCaption.h"
 #include "views/kit/CardButtons.h"
 
-class QLabel;
 class QPushButton;
 
 namespace lumora {
@@ -30,7 +29,9 @@ public:
 
     QPushButton* plus() const { return m_plus; }
     QPushButton* minus() const { return m_minus; }
-    QLabel* copies() const { return m_copies; }
+    QPushButton* copies() const { return m_copies; }
+    // A press of the number is one of its own, and not of the picture.
+    void setCopiesTyped(bool typed);
     QWidget* mark() const { return m_strip; }
     // Side of the square that is left for the picture, in pixels of the screen.
     int pictureSide() const;
@@ -51,7 +52,7 @@ private:
     Look m_look;
     QWidget* m_strip;
     QPushButton* m_minus;
-    QLabel* m_copies;
+    QPushButton* m_copies;
     QPushButton* m_plus;
 };
 

@@ -4,6 +4,7 @@
 #include "views/kit/CardOffer.h"
 #include "views/kit/EditableCombo.h"
 #include "views/kit/Gauge.h"
+#include "views/kit/KeyRows.h"
 #include "views/kit/Overlay.h"
 #include "views/kyoskNew/LargePicture.h"
 #include "views/kyoskNew/PictureCell.h"
@@ -67,6 +68,7 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     frame().content()->addWidget(body, 1);
     makeBars();
     makeQuestions();
+    makeCopiesPanel();
     makeClosingPanel();
     makeBranchPanel();
     m_focusRequest = page.focusRequest();
@@ -113,6 +115,8 @@ PictureCell* kyoskNewView::makeCell(int i) {
     bindName(cell, c.Picture1[at]);
     bindName(cell->mark(), c.Picture4[at]);
     bindName(cell->copies(), c.Label4[at]);
+    cell->setCopiesTyped(m_page.typesCopies());
+    connect(cell->copies(), &QPushButton::clicked, this, [this, i] { m_page.Label4_Click(i); });
     bindName(cell->plus(), c.Command12[at]);
     bindName(cell->minus(), c.Command13[at]);
     return cell;
@@ -199,15 +203,38 @@ void kyoskNewView::makeQuestions() {
                               button(c.Command21, Role::Main, &kyoskNew::Command21_Click));
 }
 
+void kyoskNewView::makeCopiesPanel() {
+    KeyRows keys;
+    for (const int digit : {1, 2, 3, 4, 5, 6, 7, 8, 9, 0}) {
+        const auto at = static_cast<std::size_t>(digit);
+        keys.digits[at] = toKey(button(c.copiesDigit[at], Role::Plain, &kyoskNew::copiesDigit_Click, digit), theme());
+    }
+    m_copiesBack = toKey(button(c.copiesBack, Role::Plain, &kyoskNew::copiesBack_Click, u"backspace"_s), theme());
+    keys.besideZero[0] = m_copiesBack;
+    m_copiesPicture = new PictureBox(theme(), this);
+    m_copiesPicture->setMinimumSize(theme().size(Extent::WideField), theme().size(Extent::Drawing));
+    m_copies = new Overlay(theme(), this,
+                           {label(c.copiesHead, "title"),
+                            inRow(Space::Far, {{inColumn(Space::Small, {{m_copiesPicture, 1},
+                                                                        centred(label(c.copiesTyped, "number")),
+                                                                        centred(label(c.copiesNote, "muted"))}),
+                                                1},
+                                               {inDigitRows(*this, theme(), keys), 1}})});
+    m_copies->addButtons(button(c.copiesCancel, Role::Secondary, &kyoskNew::copiesCancel_Click),
+                         button(c.copiesDone, Role::Main, &kyoskNew::copiesDone_Click));
+    m_copies->whenEscaped(toPage(&kyoskNew::copiesCancel_Click));
+}
+
 void kyoskNewView::makeClosingPanel() {
     // The tab order is the order in which the controls are made.
     QPushButton* prices = button(c.Image17, Role::Quiet, &kyoskNew::Image17_Click, u"tag"_s);
     m_mail = field(c.Text1, toPage(&kyoskNew::Text1_Change));
-    m_mail->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     m_domain = new EditableCombo(this, toPage(&kyoskNew::Combo1_Click), toPage(&kyoskNew::Combo1_Change));
     bind(m_domain, c.Combo1);
+    setDomainBox(*m_mail, *m_domain);
     m_at = words("large", u"@"_s);
     m_albumMail = field(c.Txt4Ml2, toPage(&kyoskNew::Txt4Ml2_Change));
+    m_albumMail->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     m_note = field(c.Text2, toPage(&kyoskNew::Text2_Change));
     m_backToPictures = button(c.Command10, Role::Secondary, &kyoskNew::Command10_Click);
     m_withoutAddress = button(c.Command7, Role::Secondary, &kyoskNew::Command7_Click);
@@ -382,6 +409,9 @@ void kyoskNewView::render() {
     setDirectedIcon(m_backToPictures, Way::Back);
     for (QPushButton* answer : m_offerButtons)
         breakLong(*answer);
+    m_copiesPicture->setPicture(c.copiesPicture.image());
+    speak(m_copiesBack, c.copiesBack.hint);
+    m_copies->setOpen(c.copiesPanel.visible);
     m_leave->setOpen(c.Frame3.visible);
     m_help->setOpen(c.Frame2.visible);
     if (c.Frame4.visible && !m_closing->isOpen())

@@ -11,6 +11,7 @@ class CardOffer;
 class EditableCombo;
 class Gauge;
 class LargePicture;
+class PictureBox;
 class PictureCell;
 class ResolutionBadge;
 
@@ -36,6 +37,7 @@ private:
     void makeBars();
     void makeQuestions();
     void makeClosingPanel();
+    void makeCopiesPanel();
     void makeBranchPanel();
     void pointAtBranch(const QObject* widget);
     void renderFolder();
@@ -67,6 +69,9 @@ private:
     QLineEdit* m_note = nullptr;
     QPushButton* m_withoutAddress = nullptr;
     QPushButton* m_backToPictures = nullptr;
+    Overlay* m_copies = nullptr;
+    PictureBox* m_copiesPicture = nullptr;
+    QPushButton* m_copiesBack = nullptr;
     Overlay* m_branches = nullptr;
     std::array<QPushButton*, 11> m_branchButtons{};
     Overlay* m_compression = nullptr;

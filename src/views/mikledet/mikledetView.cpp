@@ -1,6 +1,7 @@
 #include "views/mikledet/mikledetView.h"
 
 #include "views/kit/CaptionField.h"
+#include "views/kit/KeyRows.h"
 #include "views/kit/Keyboard.h"
 #include "views/kit/PaletteBar.h"
 
@@ -8,8 +9,6 @@
 #include <QCheckBox>
 #include <QKeyEvent>
 #include <QStackedLayout>
-
-#include <algorithm>
 
 namespace lumora {
 
@@ -30,16 +29,9 @@ mikledetView::mikledetView(mikledet& page, const SessionState& state, const Them
     start();
 }
 
-QPushButton* mikledetView::toKey(QPushButton* made) {
-    setRole(made, made->property("role") == u"quiet"_s ? "wordKey" : "key");
-    made->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-    made->setFixedHeight(std::max(44, theme().px(50)));
-    return made;
-}
-
 QPushButton* mikledetView::key(int number) {
     const auto at = static_cast<std::size_t>(number);
-    m_keys[at] = toKey(button(c.leter[at], Role::Plain, &mikledet::leter_Click, number));
+    m_keys[at] = toKey(button(c.leter[at], Role::Plain, &mikledet::leter_Click, number), theme());
     m_keys[at]->setProperty("letterOfAnyLanguage", true);
     return m_keys[at];
 }
@@ -126,50 +118,31 @@ QWidget* mikledetView::makeSymbols() {
     return box;
 }
 
-// The keys lie as on a real keyboard, whose letters run from left to right in both languages.
 QWidget* mikledetView::makeKeys() {
-    QGridLayout* grid = inGrid(Space::Tight);
-    constexpr int keyColumns = KeyLayout::columns;
-    const auto places = KeyLayout::places();
-    for (int at = 0; at < KeyLayout::letterKeys; ++at)
-        grid->addWidget(key(places[static_cast<std::size_t>(at)]), at / keyColumns, at % keyColumns);
-    QPushButton* back = toKey(button(c.Command3, Role::Plain, &mikledet::Command3_Click, u"backspace"_s));
-    m_spoken.emplace_back(back, &c.Command3.hint);
-    grid->addWidget(back, 0, keyColumns);
-    QPushButton* enter = toKey(button(c.Command7, Role::Quiet, &mikledet::Command7_Click, u"enter"_s));
-    enter->setMaximumHeight(QWIDGETSIZE_MAX);
-    enter->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
-    grid->addWidget(enter, 1, keyColumns, 2, 1);
+    KeyRows keys;
+    for (const int place : KeyLayout::places())
+        keys.letters.push_back(key(place));
+    keys.back = toKey(button(c.Command3, Role::Plain, &mikledet::Command3_Click, u"backspace"_s), theme());
+    m_spoken.emplace_back(keys.back, &c.Command3.hint);
+    keys.enter = toKey(button(c.Command7, Role::Quiet, &mikledet::Command7_Click, u"enter"_s), theme());
+    for (const int digit : {1, 2, 3, 4, 5, 6, 7, 8, 9, 0})
+        keys.digits[static_cast<std::size_t>(digit)] = key(KeyLayout::firstDigit + digit);
 
-    // The digits lie as on a telephone.
-    constexpr int digits = keyColumns + 2;
-    for (int digit = 1; digit <= 9; ++digit)
-        grid->addWidget(key(KeyLayout::firstDigit + digit), (digit - 1) / 3, digits + (digit - 1) % 3);
-    grid->addWidget(key(KeyLayout::firstDigit), 3, digits, 1, 3);
-
-    const auto letters = [&](const CheckCaption& caption, const QString& spoken, void (mikledet::*clicked)(),
-                             int column) {
-        QPushButton* made = toKey(choice(caption, spoken, toPage(clicked)));
+    const auto letters = [&](const CheckCaption& caption, const QString& spoken, void (mikledet::*clicked)()) {
+        QPushButton* made = toKey(choice(caption, spoken, toPage(clicked)), theme());
         made->setProperty("letterOfAnyLanguage", true);
-        grid->addWidget(made, 3, column);
+        keys.bottom.push_back({made, 1});
     };
-    letters(c.Command4, c.words.hebrewLetters, &mikledet::Command4_Click, 0);
-    letters(c.Command9, c.words.smallLetters, &mikledet::Command9_Click, 1);
-    letters(c.Command2, c.words.capitalLetters, &mikledet::Command2_Click, 2);
-    const auto wordKey = [&](const Caption& caption, void (mikledet::*clicked)(), int column, int width) {
-        grid->addWidget(toKey(button(caption, Role::Quiet, clicked)), 3, column, 1, width);
+    letters(c.Command4, c.words.hebrewLetters, &mikledet::Command4_Click);
+    letters(c.Command9, c.words.smallLetters, &mikledet::Command9_Click);
+    letters(c.Command2, c.words.capitalLetters, &mikledet::Command2_Click);
+    const auto wordKey = [&](const Caption& caption, void (mikledet::*clicked)(), int width) {
+        keys.bottom.push_back({toKey(button(caption, Role::Quiet, clicked), theme()), width});
     };
-    wordKey(c.Command5, &mikledet::Command5_Click, 3, 1);
-    wordKey(c.Command1, &mikledet::Command1_Click, 4, 4);
-    wordKey(c.Command6, &mikledet::Command6_Click, 8, 3);
-
-    for (int i = 0; i < keyColumns; ++i)
-        grid->setColumnStretch(i, 10);
-    grid->setColumnStretch(keyColumns, 14);
-    grid->setColumnMinimumWidth(keyColumns + 1, theme().size(Space::Small));
-    for (int i = 0; i < 3; ++i)
-        grid->setColumnStretch(digits + i, 10);
-    return leftToRight(grid);
+    wordKey(c.Command5, &mikledet::Command5_Click, 1);
+    wordKey(c.Command1, &mikledet::Command1_Click, 4);
+    wordKey(c.Command6, &mikledet::Command6_Click, 3);
+    return inKeyRows(*this, theme(), keys);
 }
 
 QWidget* mikledetView::firstFocus() const {

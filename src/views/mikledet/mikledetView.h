@@ -29,7 +29,6 @@ private:
     QWidget* makeSymbols();
     QWidget* makeKeys();
     QPushButton* key(int number);
-    QPushButton* toKey(QPushButton* button);
     QPushButton* toRound(QPushButton* button, const Caption& caption);
     QPushButton* holdButton(const Caption& caption, const char* icon, std::function<void()> down,
                             std::function<void()> up);
