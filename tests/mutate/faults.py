@@ -595,4 +595,18 @@ FAULTS = {
     'src/views/kit/Keyboard.cpp': [F('button->click();', '', 'Enter on a button does nothing', seen=True)],
     'src/views/kit/CaptionField.cpp': [F("type(u'\\b');", '', 'a caption can not be taken back')],
     'src/views/kit/ChoiceCards.cpp': [F('row == current', 'false', 'the chosen paper is not shown')],
+    'src/views/kit/TouchKeyboard.cpp': [
+        F('m_capitals ? small.toUpper() : small', 'small', 'no name on the screen begins with a large letter'),
+        F('made->setFocusPolicy(Qt::NoFocus);', '', 'a key takes the focus, and the keys go')],
+    'src/views/window/FieldKeyboard.cpp': [
+        F('lowest - m_keys->y()', '0', 'the field lies behind the keys'),
+        F('line->echoMode() != QLineEdit::Normal', 'false', 'keys rise for what is hidden'),
+        F('before.back().isSpace()', 'false', 'a second name begins small'),
+        F('field && field == touched', 'field', 'keys rise where nobody has touched')],
+    'src/views/window/PressFilter.cpp': [
+        F('away.manhattanLength() > samePlace', 'true', 'the second half of a doubled touch types a letter'),
+        F('rule.seen();', '', 'who types fast loses letters')],
+    'src/selection/CopiesEntry.cpp': [
+        F('copies <= PrintCode::mostCopies', 'true', 'a hundred copies are ordered'),
+        F('m_begun ? m_text.toInt() : 0', 'm_text.toInt()', 'a 5 behind the 1 that stood there orders 15')],
 }

@@ -8,6 +8,7 @@
 #include "support/Take.h"
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/Overlay.h"
+#include "views/kit/TouchKeyboard.h"
 #include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
@@ -326,7 +327,10 @@ QStringList Walk::faults() {
     MainWindow& window = m_program->window();
     unnamed(QAccessible::queryAccessibleInterface(&window), result);
     const Overlay* panel = frontOverlay(window);
-    const QWidget* root = panel ? static_cast<const QWidget*>(panel) : window.frontView();
+    const auto* keys = window.findChild<TouchKeyboard*>();
+    const QWidget* root = keys && keys->isVisible() ? static_cast<const QWidget*>(keys)
+                          : panel                   ? static_cast<const QWidget*>(panel)
+                                                    : window.frontView();
     if (root->layoutDirection() != (english ? Qt::LeftToRight : Qt::RightToLeft))
         result += u"the page runs the other way"_s;
     if (english && hasHebrew(window.windowTitle()))

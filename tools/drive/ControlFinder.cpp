@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "views/kit/ChoiceCards.h"
+#include "views/kit/TouchKeyboard.h"
 #include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
@@ -15,7 +16,11 @@
 #include <QListWidget>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
+#include <QPointingDevice>
+#include <QPushButton>
 #include <QScrollArea>
+#include <QWindow>
+#include <QtGui/qtestsupport_gui.h>
 
 #include <algorithm>
 #include <cmath>
@@ -33,6 +38,14 @@ Failure fail(const QString& text) {
 // The middle of the part of the widget that the window shows; a scroll area may hide the rest.
 QPoint middleOf(const QWidget& widget) {
     return widget.visibleRegion().boundingRect().center();
+}
+
+// A tick box reacts only inside its own contents, and its tick mark is at one side.
+QPoint placeToPress(const QWidget& widget) {
+    const QRect box = widget.rect();
+    return qobject_cast<const QCheckBox*>(&widget)
+               ? QPoint(widget.layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())
+               : middleOf(widget);
 }
 
 void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held,
@@ -59,6 +72,16 @@ void letMouseGo(const ControlFinder::Held& held) {
 
 void click(QWidget& widget, QPoint at) {
     letMouseGo(pressDown(widget, at));
+}
+
+// A finger at the screen, whose press comes to the controls as that of a mouse.
+void tap(QWidget& widget, QPoint at) {
+    static QPointingDevice* const finger = QTest::createTouchDevice();
+    QWidget& window = *widget.window();
+    const QPointF place = widget.mapTo(&window, at);
+    for (const auto state : {QEventPoint::Pressed, QEventPoint::Released})
+        qt_handleTouchEvent(window.windowHandle(), finger, {{0, state, place, window.mapToGlobal(place)}});
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::MetaCall); // the keys rise behind the touch
 }
 
 QPoint pointOf(const QWidget& widget, QPointF percent) {
@@ -262,6 +285,48 @@ Result<void> ControlFinder::type(const QString& page, const QString& control, co
     return {};
 }
 
+Result<void> ControlFinder::touchKey(const QString& name) const {
+    const auto* keyboard = m_window.findChild<TouchKeyboard*>();
+    if (!keyboard || !keyboard->isVisible())
+        return fail(u"no keys are on the screen"_s);
+    for (QPushButton* found : keyboard->findChildren<QPushButton*>(name)) {
+        if (!whyNotPressable(*found).isEmpty())
+            continue;
+        m_window.presses().rest();
+        tap(*found, middleOf(*found));
+        return {};
+    }
+    return fail(u"no key \"%1\" can be touched"_s.arg(name));
+}
+
+Result<void> ControlFinder::touch(const QString& page, const QString& control) const {
+    if (page == u"keyboard"_s)
+        return touchKey(control);
+    const Result<QWidget*> widget = pressable(page, control);
+    if (!widget)
+        return widget.failure();
+    QWidget& hit = target(**widget);
+    tap(hit, placeToPress(hit));
+    return {};
+}
+
+Result<void> ControlFinder::touchType(const QString& page, const QString& control, const QString& text) const {
+    if (const Result<void> touched = touch(page, control); !touched)
+        return touched.failure();
+    for (const QChar letter : text) {
+        const QString name = letter == u' ' ? u"keySpace"_s : u"key(%1)"_s.arg(letter);
+        Result<void> typed = touchKey(name);
+        // The other case, then the other letters in either.
+        for (const QString& first : {u"keyCapitals"_s, u"keyLetters"_s, u"keyCapitals"_s}) {
+            if (!typed && touchKey(first))
+                typed = touchKey(name);
+        }
+        if (!typed)
+            return typed.failure();
+    }
+    return {};
+}
+
 Result<void> ControlFinder::choose(const QString& page, const QString& control, const QString& text) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)
@@ -306,14 +371,8 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
     auto* button = qobject_cast<QAbstractButton*>(*found);
     if (!button || !button->isCheckable())
         return fail(u"%1.%2 can't be ticked"_s.arg(page, control));
-    if (button->isChecked() != on) {
-        const QRect box = button->rect();
-        // The press is at the tick mark: a tick box reacts only inside its own contents.
-        click(*button,
-              qobject_cast<QCheckBox*>(button)
-                  ? QPoint(button->layoutDirection() == Qt::RightToLeft ? box.right() - 16 : 16, box.center().y())
-                  : middleOf(*button));
-    }
+    if (button->isChecked() != on)
+        click(*button, placeToPress(*button));
     return {};
 }
 

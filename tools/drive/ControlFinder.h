@@ -42,6 +42,10 @@ public:
     Result<void> drag(const QString& page, const QString& control, QPointF from, QPointF to) const;
     // Replaces the contents of a text box.
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
+    // With a finger. The page "keyboard" is the keys on the screen.
+    Result<void> touch(const QString& page, const QString& control) const;
+    // Touches the box, and then the keys on the screen, also those that bring other letters.
+    Result<void> touchType(const QString& page, const QString& control, const QString& text) const;
     // Chooses the row with this text in a list or a combo box.
     Result<void> choose(const QString& page, const QString& control, const QString& text) const;
     Result<void> tick(const QString& page, const QString& control, bool on) const;
@@ -58,6 +62,7 @@ public:
     static QString whyNotPressable(const QWidget& widget);
 
 private:
+    Result<void> touchKey(const QString& name) const;
     Result<PageView*> view(const QString& page) const;
     Result<QWidget*> inSight(const QString& page, const QString& control) const;
     Result<QWidget*> pressable(const QString& page, const QString& control) const;

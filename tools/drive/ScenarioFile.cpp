@@ -40,13 +40,21 @@ struct Grammar {
 
 constexpr double patienceOfPage = 30; // seconds, if the line names none
 
-const std::array<Grammar, 20>& grammars() {
-    static const std::array<Grammar, 20> all{{
+const std::array<Grammar, 22>& grammars() {
+    static const std::array<Grammar, 22> all{{
         {ScenarioVerb::Page,
          "page",
          {Takes::Page, Takes::OptionalSeconds},
          "NAME [SECONDS]: wait until that page is in front"},
         {ScenarioVerb::Press, "press", {Takes::Control}, "PAGE.CONTROL"},
+        {ScenarioVerb::Touch,
+         "touch",
+         {Takes::Control},
+         "PAGE.CONTROL, or a key on the screen by its name, \"keyboard.keyDone\": with a finger"},
+        {ScenarioVerb::TouchType,
+         "touch-type",
+         {Takes::Control, Takes::SomeText},
+         "PAGE.CONTROL TEXT: touches a box and then the keys on the screen"},
         {ScenarioVerb::PressAt,
          "press-at",
          {Takes::Control, Takes::From, Takes::OptionalRight},

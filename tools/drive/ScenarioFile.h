@@ -13,6 +13,8 @@ namespace lumora {
 enum class ScenarioVerb {
     Page,
     Press,
+    Touch,
+    TouchType,
     PressAt,
     Hold,
     Drag,

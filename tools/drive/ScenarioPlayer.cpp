@@ -32,7 +32,7 @@ constexpr double patienceOfWork = 900;  // seconds until work that does not end 
 bool touches(ScenarioVerb verb) {
     return verb == ScenarioVerb::Press || verb == ScenarioVerb::PressAt || verb == ScenarioVerb::Hold ||
            verb == ScenarioVerb::Drag || verb == ScenarioVerb::Type || verb == ScenarioVerb::Choose ||
-           verb == ScenarioVerb::Tick;
+           verb == ScenarioVerb::Tick || verb == ScenarioVerb::Touch || verb == ScenarioVerb::TouchType;
 }
 
 QString deed(ScenarioVerb verb) {
@@ -41,6 +41,9 @@ QString deed(ScenarioVerb verb) {
         return u"hold"_s;
     case ScenarioVerb::Drag:
         return u"drag"_s;
+    case ScenarioVerb::Touch:
+        return u"touch"_s;
+    case ScenarioVerb::TouchType:
     case ScenarioVerb::Type:
         return u"type into"_s;
     case ScenarioVerb::Choose:
@@ -160,6 +163,10 @@ Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
     switch (command.verb) {
     case ScenarioVerb::PressAt:
         return m_controls.pressAt(page, control, command.from, command.rightKey ? Qt::RightButton : Qt::LeftButton);
+    case ScenarioVerb::Touch:
+        return m_controls.touch(page, control);
+    case ScenarioVerb::TouchType:
+        return m_controls.touchType(page, control, command.text);
     case ScenarioVerb::Drag:
         return m_controls.drag(page, control, command.from, command.to);
     case ScenarioVerb::Type:
@@ -234,6 +241,8 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
     case ScenarioVerb::Type:
     case ScenarioVerb::Choose:
     case ScenarioVerb::Tick:
+    case ScenarioVerb::Touch:
+    case ScenarioVerb::TouchType:
         break; // done by touch()
     }
     return {};

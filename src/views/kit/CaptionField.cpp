@@ -13,6 +13,7 @@ CaptionField::CaptionField(Handlers handlers, QWidget* parent)
     , m_handlers(std::move(handlers)) {
     setContextMenuPolicy(Qt::NoContextMenu);
     setAcceptDrops(false);
+    setProperty("ownKeys", true);
     // A caption's base direction is left to right in both languages, as it is drawn on the print.
     setLayoutDirection(Qt::LeftToRight);
 }

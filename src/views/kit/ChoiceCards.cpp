@@ -21,6 +21,8 @@ ChoiceCards::ChoiceCards(const Theme& theme, QWidget* parent, int columns, Maker
 }
 
 void ChoiceCards::display(const QStringList& rows, int current) {
+    setFocusProxy(nullptr);
+    setFocusPolicy(Qt::TabFocus); // without it the cards can't have their turn behind this
     while (m_cards.size() > rows.size())
         m_cards.takeLast()->deleteLater();
     for (int row = static_cast<int>(m_cards.size()); row < rows.size(); ++row) {
@@ -30,6 +32,8 @@ void ChoiceCards::display(const QStringList& rows, int current) {
         card->setObjectName(u"%1(%2)"_s.arg(objectName()).arg(row));
         connect(card, &QAbstractButton::clicked, this, [this, row] { Q_EMIT activated(row); });
         m_grid->addWidget(card, row / m_columns, row % m_columns);
+        // A card that is made late has its turn where the cards stand, not behind the whole page.
+        setTabOrder(m_cards.isEmpty() ? static_cast<QWidget*>(this) : m_cards.back(), card);
         m_cards += card;
     }
     for (int row = 0; row < rows.size(); ++row) {
@@ -39,6 +43,7 @@ void ChoiceCards::display(const QStringList& rows, int current) {
         card->setProperty("row", rows[row]);
         card->setChecked(row == current);
     }
+    setFocusPolicy(Qt::NoFocus);
     setFocusProxy(m_cards.value(std::max(current, 0)));
 }
 

@@ -51,4 +51,15 @@ void EditableCombo::choosePrompt() {
         lineEdit()->selectAll();
 }
 
+void setDomainBox(QLineEdit& field, EditableCombo& box) {
+    field.setInputMethodHints(Qt::ImhEmailCharactersOnly);
+    box.setInputMethodHints(Qt::ImhEmailCharactersOnly); // its box that is typed in has those of the whole
+    field.setProperty("domainBox", QVariant::fromValue<QWidget*>(&box));
+}
+
+QComboBox* domainBoxOf(const QWidget& field) {
+    auto* box = qobject_cast<QComboBox*>(field.property("domainBox").value<QWidget*>());
+    return box && box->isVisible() ? box : nullptr;
+}
+
 } // namespace lumora

@@ -5,6 +5,8 @@
 
 #include <functional>
 
+class QLineEdit;
+
 namespace lumora {
 
 // A box that offers rows and takes a typed text too. What a program sets in it calls neither of the two. A prompt is
@@ -25,5 +27,10 @@ private:
 
     QString m_prompt; // empty while the box says something else
 };
+
+// The box takes the domain of the mail address that begins in the field, behind the "@" between them.
+void setDomainBox(QLineEdit& field, EditableCombo& box);
+// Null where the field has none.
+QComboBox* domainBoxOf(const QWidget& field);
 
 } // namespace lumora

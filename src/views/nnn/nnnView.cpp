@@ -20,6 +20,8 @@ using namespace Qt::StringLiterals;
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Details);
+    // The tab order is the order in which the controls are made.
+    makeHeader();
     auto* content = new QWidget(this);
     m_steps = new QStackedLayout(content);
     // In the order of nnn::Step.
@@ -194,12 +196,15 @@ QWidget* nnnView::makeTerms() {
     return inMiddle(inBox(inColumn(Space::Wide, {summary.frame, terms.frame, Item::room()})), 4);
 }
 
-void nnnView::makeBars() {
+void nnnView::makeHeader() {
     QPushButton* hebrew = button(c.Command4Ivrit, Role::Quiet, &nnn::Command4Ivrit_Click, u"globe"_s);
     hebrew->setProperty("letterOfAnyLanguage", true);
     frame().addHeaderActions({button(c.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
                               hebrew,
                               button(c.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
+}
+
+void nnnView::makeBars() {
     m_back = button(c.Command4, Role::Secondary, &nnn::Command4_Click);
     frame().addSecondaryActions({m_back, button(c.Command2, Role::Quiet, &nnn::Command2_Click),
                                  button(c.Command15, Role::Secondary, &nnn::Command15_Click, u"info"_s),
@@ -209,7 +214,7 @@ void nnnView::makeBars() {
     frame().addMainActions(
         {button(c.Command12, Role::Main, &nnn::Command12_Click), button(c.Command8, Role::Main, &nnn::Command8_Click),
          button(c.Command6, Role::Main, &nnn::Command6_Click), button(c.Command3, Role::Main, &nnn::Command3_Click)});
-    for (QPushButton* main : m_album->mainButtons())
+    for (QPushButton* main : m_album->makeMainButtons())
         frame().addMainAction(main);
 
     m_clean = new Overlay(theme(), this, {label(c.Frame1, "large")});

@@ -34,6 +34,7 @@ private:
     QWidget* makeBorders();
     QWidget* makeFit();
     QWidget* makeTerms();
+    void makeHeader();
     void makeBars();
     void placeTiles();
 

@@ -41,17 +41,17 @@ nnnView::Album::Album(nnnView& view)
     m_panels->addWidget(makeBill());
     for (int i = 0; i < m_panels->count(); ++i)
         changesSight(*m_panels->widget(i));
-    addNext(m_shown.Command17, &AlbumPanels::Command17_Click);
-    addNext(m_shown.Command16, &AlbumPanels::Command16_Click);
-    addNext(m_shown.Command18, &AlbumPanels::Command18_Click);
-    addNext(m_shown.Command19, &AlbumPanels::Command19_Click);
-    addNext(m_shown.Command20, &AlbumPanels::Command20_Click);
-    addNext(m_shown.Command21, &AlbumPanels::Command21_Click);
-    addNext(m_shown.Command22, &AlbumPanels::Command22_Click);
 }
 
-void nnnView::Album::addNext(const Caption& caption, void (AlbumPanels::*pressed)()) {
-    m_mainButtons += m_view.button(caption, Role::Main, toAlbum(pressed));
+QList<QPushButton*> nnnView::Album::makeMainButtons() {
+    const auto next = [this](const Caption& caption, void (AlbumPanels::*pressed)()) {
+        return m_view.button(caption, Role::Main, toAlbum(pressed));
+    };
+    return {
+        next(m_shown.Command17, &AlbumPanels::Command17_Click), next(m_shown.Command16, &AlbumPanels::Command16_Click),
+        next(m_shown.Command18, &AlbumPanels::Command18_Click), next(m_shown.Command19, &AlbumPanels::Command19_Click),
+        next(m_shown.Command20, &AlbumPanels::Command20_Click), next(m_shown.Command21, &AlbumPanels::Command21_Click),
+        next(m_shown.Command22, &AlbumPanels::Command22_Click)};
 }
 
 ChoiceCards* nnnView::Album::cards(const ComboCaption& choice, int columns, const QList<AlbumDrawing>& drawings,
@@ -82,10 +82,10 @@ QWidget* nnnView::Album::makePhotographer() {
     box(2, 3, 0, 2);
     box(3, 6, 0, 2);
     m_boxes[1]->setInputMethodHints(Qt::ImhDialableCharactersOnly);
-    m_boxes[3]->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     m_domain =
         new EditableCombo(&m_view, toAlbum(&AlbumPanels::Combo4Mail_Click), toAlbum(&AlbumPanels::Combo4Mail_Change));
     m_view.bind(m_domain, m_shown.Combo4Mail);
+    setDomainBox(*m_boxes[3], *m_domain);
     // An address runs from left to right in both languages.
     grid->addWidget(leftToRight(inRow(Space::Small, {{m_boxes[3], 3}, words("large", u"@"_s), {m_domain, 2}})), 7, 0, 1,
                     2);

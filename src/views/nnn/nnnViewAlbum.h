@@ -20,7 +20,7 @@ public:
     // Holds all panels and shows one.
     QWidget* widget() const { return m_widget; }
     // The buttons that lead to the next panel, one for each panel.
-    QList<QPushButton*> mainButtons() const { return m_mainButtons; }
+    QList<QPushButton*> makeMainButtons();
     QWidget* firstFocus() const;
     void render();
 
@@ -37,7 +37,6 @@ private:
     auto toAlbum(void (AlbumPanels::*handler)(Values...)) const {
         return [&album = m_album, handler](Values... values) { (album.*handler)(values...); };
     }
-    void addNext(const Caption& caption, void (AlbumPanels::*pressed)());
 
     nnnView& m_view;
     AlbumPanels& m_album;
@@ -57,7 +56,6 @@ private:
     QLabel* m_bill = nullptr;
     QLabel* m_billExtras = nullptr;
     QLabel* m_billParents = nullptr;
-    QList<QPushButton*> m_mainButtons;
     AlbumPanels::Panel m_shownPanel = AlbumPanels::Panel::Photographer;
 };
 

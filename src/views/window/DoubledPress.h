@@ -24,6 +24,8 @@ public:
     // Whether the press counts. One may be told twice, as those of a finger are.
     bool pressed();
     void released();
+    // What has changed was seen, since a press there was meant.
+    void seen() { m_waits = false; }
 
     // Turns the clock on by a pause with the hand up: so a program that presses in place of a person goes through the
     // same rule, as one who looks before each press, and need not wait.

@@ -3,13 +3,14 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "views/kit/FocusRing.h"
+#include "views/kit/LiftedStack.h"
 #include "views/kit/Overlay.h"
+#include "views/window/FieldKeyboard.h"
 #include "views/window/PageView.h"
 #include "views/window/PressFilter.h"
 
 #include <QApplication>
 #include <QCloseEvent>
-#include <QStackedLayout>
 #include <QTimer>
 
 #include <algorithm>
@@ -22,12 +23,13 @@ MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     : m_chain(chain)
     , m_state(state)
     , m_theme(std::make_unique<Theme>(1.0))
+    , m_keyboard(new FieldKeyboard(*this, *m_theme, state))
     , m_presses(new PressFilter(this)) {
     setObjectName(u"lumoraWindow"_s);
     setAttribute(Qt::WA_StyledBackground);
     setWindowTitle(u"Lumora"_s);
     setMinimumSize(800, 600);
-    m_stack = new QStackedLayout(this);
+    m_stack = new LiftedStack(this);
     m_stack->setContentsMargins(0, 0, 0, 0);
     setStyleSheet(m_theme->styleSheet());
     new FocusRing(*m_theme, this);
@@ -153,6 +155,7 @@ void MainWindow::pageUnloaded(Page* page) {
 
 void MainWindow::resizeEvent(QResizeEvent*) {
     placePanel();
+    m_keyboard->place();
     const double factor = Theme::factorFor(size());
     if (factor != m_theme->factor())
         QTimer::singleShot(0, this, &MainWindow::rebuild);
@@ -162,6 +165,7 @@ void MainWindow::rebuild() {
     const double factor = Theme::factorFor(size());
     if (factor == m_theme->factor())
         return;
+    m_keyboard->forget();
     *m_theme = Theme(factor);
     setStyleSheet(m_theme->styleSheet());
     const Page* front = m_front ? &m_front->page() : nullptr;

@@ -16,6 +16,7 @@ class QStackedLayout;
 namespace lumora {
 
 class DoubledPress;
+class FieldKeyboard;
 class PageChain;
 class PageView;
 class PressFilter;
@@ -65,6 +66,7 @@ private:
     std::unique_ptr<Theme> m_theme;
     std::map<PageId, ViewMaker> m_makers;
     std::map<const Page*, PageView*> m_views;
+    FieldKeyboard* m_keyboard; // before the filter, which is asked first then
     PressFilter* m_presses;
     QStackedLayout* m_stack = nullptr;
     PageView* m_front = nullptr;

@@ -1,5 +1,7 @@
 #include "views/window/PressFilter.h"
 
+#include "views/kit/TouchKeyboard.h"
+
 #include <QApplication>
 #include <QElapsedTimer>
 #include <QKeyEvent>
@@ -12,6 +14,8 @@
 namespace lumora {
 
 namespace {
+
+constexpr double samePlace = 40; // logical pixels
 
 // A blank is a letter where text is typed.
 bool isPress(const QKeyEvent& key, const QWidget& receiver) {
@@ -34,6 +38,15 @@ PressFilter::PressFilter(QWidget* window)
     qApp->installEventFilter(this);
 }
 
+// Who types fast begins before the pause behind the rising of the keys is over. There a doubled press is one at the
+// same place.
+bool PressFilter::counts(const QWidget& widget, QPointF at) {
+    const QPointF away = at - std::exchange(m_at, at);
+    if (TouchKeyboard::has(widget) && away.manhattanLength() > samePlace)
+        rule.seen();
+    return rule.pressed();
+}
+
 bool PressFilter::eventFilter(QObject* watched, QEvent* event) {
     auto* widget = qobject_cast<QWidget*>(watched);
     const bool ours = widget && widget->window() == m_window;
@@ -54,7 +67,7 @@ bool PressFilter::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
         if (ours)
-            m_mouseTaken = !rule.pressed();
+            m_mouseTaken = !counts(*widget, static_cast<const QMouseEvent&>(*event).globalPosition());
         return ours && m_mouseTaken;
     case QEvent::MouseMove:
         if (static_cast<const QMouseEvent&>(*event).buttons() == Qt::NoButton)
@@ -67,7 +80,9 @@ bool PressFilter::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::TouchBegin:
         if (watched == m_window->windowHandle())
             rule.pressed();
-        break;
+        // Only the keys on the screen take a finger as such.
+        return ours && TouchKeyboard::has(*widget) &&
+               !counts(*widget, static_cast<const QTouchEvent&>(*event).points().front().globalPosition());
     case QEvent::TouchEnd:
     case QEvent::TouchCancel:
         if (watched == m_window->windowHandle())

@@ -3,6 +3,7 @@
 #include "views/window/DoubledPress.h"
 
 #include <QObject>
+#include <QPointF>
 
 class QWidget;
 
@@ -20,7 +21,10 @@ protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
+    bool counts(const QWidget& widget, QPointF at);
+
     QWidget* m_window;
+    QPointF m_at;              // of the press before, on the screen
     bool m_mouseTaken = false; // a press that did not count, until it is let go
     bool m_keyTaken = false;
 };
