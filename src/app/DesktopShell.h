@@ -2,6 +2,8 @@
 
 #include "platform/Machine.h"
 
+#include <functional>
+
 namespace lumora {
 
 class Drives;
@@ -12,9 +14,13 @@ public:
     explicit DesktopShell(const Drives& drives)
         : m_drives(drives) {}
 
+    // Where it says no, neither pages nor folders open.
+    std::function<bool()> mayOpen;
+
     void openWebPage(const QString& url) override;
     void openFolder(const DrivePath& folder) override;
     void copyToClipboard(const QString& text) override;
+    void clearClipboard() override;
 
 private:
     const Drives& m_drives;

@@ -23,6 +23,11 @@ public:
     enum class Offer { Pictures, EveryFile };
     virtual DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
                                Offer offer = Offer::Pictures) = 0;
+
+    // A question or the picker waits for a person.
+    virtual bool isWaiting() const { return false; }
+    // As if the person had closed all of them.
+    virtual void closeAll() {}
 };
 
 } // namespace lumora

@@ -36,6 +36,8 @@ public:
     virtual void openWebPage(const QString& url) = 0;
     virtual void openFolder(const DrivePath& folder) = 0;
     virtual void copyToClipboard(const QString& text) = 0;
+    // Also what was marked and never copied.
+    virtual void clearClipboard() = 0;
 };
 
 class Volume {

@@ -44,6 +44,12 @@ public:
     virtual void load() {}
     // Sets all the page's texts in the language of the session.
     virtual void setTexts() {}
+    // Works by itself, and is not to be cut when nobody is there.
+    virtual bool isWorking() const { return false; }
+    // Nothing on it comes of a customer.
+    virtual bool isUntouched() const { return false; }
+    // Nobody is there any more, and the page will be taken away.
+    virtual void leftAlone() {}
 
 Q_SIGNALS:
     // A view renders once, however often this is sent meanwhile.

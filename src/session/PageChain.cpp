@@ -7,8 +7,15 @@
 
 #include <algorithm>
 #include <cassert>
+#include <utility>
 
 namespace lumora {
+
+namespace {
+
+constexpr int untilFree = 20; // milliseconds between two looks
+
+} // namespace
 
 PageChain::~PageChain() = default;
 
@@ -28,7 +35,7 @@ Page& PageChain::load(PageId id) {
 }
 
 bool PageChain::show(PageId id) {
-    if (m_ended || !isRegistered(id))
+    if (hasEnded() || !isRegistered(id))
         return false;
     Page* page = &load(id);
     std::erase(m_shown, page);
@@ -62,7 +69,7 @@ void PageChain::unload(PageId id) {
     const bool wasFront = front() == page;
     const bool wasShown = std::erase(m_shown, page) > 0;
     Q_EMIT unloaded(page);
-    if (m_ended || !wasShown)
+    if (hasEnded() || !wasShown)
         return;
     if (m_shown.empty())
         show(PageId::hatchala);
@@ -74,10 +81,44 @@ void PageChain::unload(PageId id) {
 void PageChain::deleteLeft() {
     if (m_left.empty())
         return;
-    if (m_pump.pumping() || QThread::currentThread()->loopLevel() > 1)
-        QTimer::singleShot(20, this, &PageChain::deleteLeft);
-    else
+    if (isFree())
         m_left.clear();
+    else
+        QTimer::singleShot(untilFree, this, &PageChain::deleteLeft);
+}
+
+bool PageChain::isFree() const {
+    return !m_pump.pumping() && QThread::currentThread()->loopLevel() <= 1;
+}
+
+void PageChain::goToStart() {
+    if (std::exchange(m_goesToStart, true))
+        return;
+    QTimer::singleShot(0, this, &PageChain::startAnew);
+}
+
+// The pages are gone before the start page comes, so that nothing of theirs is written behind it.
+void PageChain::startAnew() {
+    if (m_ended)
+        return;
+    if (!isFree()) {
+        QTimer::singleShot(untilFree, this, &PageChain::startAnew);
+        return;
+    }
+    while (!m_pages.empty())
+        unload(m_pages.begin()->first);
+    m_left.clear();
+    m_goesToStart = false;
+    show(PageId::hatchala);
+}
+
+bool PageChain::isAnyWorking() const {
+    return std::any_of(m_pages.begin(), m_pages.end(), [](const auto& page) { return page.second->isWorking(); });
+}
+
+void PageChain::setAllTexts() const {
+    for (const auto& [id, page] : m_pages)
+        page->setTexts();
 }
 
 Page* PageChain::find(PageId id) const {
@@ -88,6 +129,10 @@ Page* PageChain::find(PageId id) const {
 void PageChain::endProgram() {
     if (m_ended)
         return;
+    if (mayEnd && !mayEnd()) {
+        goToStart();
+        return;
+    }
     m_ended = true;
     Q_EMIT ended();
 }

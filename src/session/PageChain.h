@@ -54,9 +54,18 @@ public:
     Page* front() const { return m_shown.empty() ? nullptr : m_shown.back(); }
     bool isRegistered(PageId id) const { return m_makers.contains(id); }
 
-    // Ends the program without saving anything: the process ends on ended().
+    // Ends the program without saving anything: the process ends on ended(). Where mayEnd says no, goes to the start
+    // page instead.
     void endProgram();
-    bool hasEnded() const { return m_ended; }
+    std::function<bool()> mayEnd;
+    // Takes all pages away, and the start page comes anew. It waits until no handler can still run, which may work on
+    // what the customer has given; a loop that asks hasEnded() stops for it.
+    void goToStart();
+    bool hasEnded() const { return m_ended || m_goesToStart; }
+
+    bool isAnyWorking() const;
+    // In the language of the session, and with what the session allows.
+    void setAllTexts() const;
 
 Q_SIGNALS:
     void shown(lumora::Page* page);
@@ -65,6 +74,8 @@ Q_SIGNALS:
 
 private:
     void deleteLeft();
+    bool isFree() const;
+    void startAnew();
 
     const EventPump& m_pump;
     std::map<PageId, Maker> m_makers;
@@ -72,6 +83,7 @@ private:
     std::vector<Page*> m_shown;                // the last one is in front
     std::vector<std::unique_ptr<Page>> m_left; // unloaded, with handlers that may still be running
     bool m_ended = false;
+    bool m_goesToStart = false;
 };
 
 } // namespace lumora

@@ -2,6 +2,7 @@
 
 #include "common/DoorRules.h"
 #include "common/DrivePath.h"
+#include "common/KioskRules.h"
 #include "platform/line/Mail.h"
 
 #include <QDateTime>
@@ -265,6 +266,8 @@ struct SessionState {
     bool Waiting = false;     // orders that did not arrive are sent by themselves while nobody is at the start page
     ScreenKeys screenKeys = ScreenKeys::Never;
     int waitingOrders = 0; // how many there are, as the start page counted them last
+    KioskRules kiosk;
+    bool staff = false; // on a kiosk: the staff has given its code
 
     ClientProfile profile;
     OrderDetails shemot;
@@ -275,6 +278,9 @@ struct SessionState {
     HandOver handOver;
     DrivePath keptFolder; // where copies of the order's pictures lie that were chosen from cards (order/KeptPictures.h)
 
+    // Customers use the machine one after another, and what is meant for the staff is closed.
+    bool closedToCustomers() const { return kiosk.on && !staff; }
+    bool mayOpenOperatorArea() const { return kiosk.on ? staff : OperatorArea; }
     bool english() const { return EnglishTips == 1; }
     // The wording in the language of the session.
     QString wording(const QString& hebrew, const QString& inEnglish) const { return english() ? inEnglish : hebrew; }

@@ -94,6 +94,14 @@ DrivePath proofPicture(const SessionState& state) {
     return root(state) / u"000.jpg";
 }
 
+DrivePath handOverTexts(const SessionState& state) {
+    return root(state) / u"Tik4txt";
+}
+
+std::array<DrivePath, 3> detailStores(const SessionState& state) {
+    return {root(state) / u"pratim.txt", root(state) / u"pratim2.txt", root(state) / u"pratim3.txt"};
+}
+
 } // namespace WorkspacePaths
 
 bool Workspace::MakeRootFolders() const {

@@ -6,6 +6,7 @@
 
 #include <QString>
 
+#include <array>
 #include <functional>
 
 namespace lumora {
@@ -26,6 +27,9 @@ DrivePath scratchPicture(const SessionState& state); // ^^^.jpg, the picture of 
 DrivePath counter(const SessionState& state);        // vedron\mispar.txt
 DrivePath toneCopy(const SessionState& state);       // bw.bmp: the grey picture that the latest toned print came from
 DrivePath proofPicture(const SessionState& state);   // 000.jpg
+DrivePath handOverTexts(const SessionState& state);  // Tik4txt: the lines of the basket
+// pratim.txt, pratim2.txt and pratim3.txt: details of a customer, of an album's photographer, of a quick order.
+std::array<DrivePath, 3> detailStores(const SessionState& state);
 } // namespace WorkspacePaths
 
 // The folder tree on the program's own drive and its clean-up before each order.

@@ -40,6 +40,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
               "[Operator]\nArea = no\nEditor = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting = yes\nKeyboard = Auto\n"
+              "Mode = yes\nIdleSeconds = 3600\nKeepDays = 7\nKeepLogDays = 9999\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -60,6 +61,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
                 lab.SplitPage && lab.FitMuzag && lab.DoarReshut && lab.TachanaMekomit && !lab.OperatorArea &&
                 lab.OperatorEditor && state.screenKeys == ScreenKeys::Touches);
     EXPECT_TRUE(lab.GvulMuzag == 0 && lab.TmunatPaar == 1 && profile.ReportOn == 0 && lab.MediniyutDchisa == 1);
+    EXPECT_TRUE(state.kiosk == (KioskRules{true, 3600, {}, 7, 9999}));
     const MailAccount& mail = lab.profile.mail;
     EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
               QStringList({"mail.lab.example", "a@b", "x^y", "kiosk@lab.example", "o'neil+orders@lab.example"}));
@@ -115,6 +117,7 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
         {"[Mail]\nServer = m\nTo = a@b\n", {"lab.ini:2:", "Mail.From is empty"}},
         {"[Mail]\nFrom = a@b\nServer = m\nTo =\n", {"lab.ini:3:", "Mail.To is empty", "orders@lab.example"}},
         {"[Switches]\nReports = perhaps\n", {"Switches.Reports", "\"perhaps\"", "yes or no"}},
+        {"[Kiosk]\nCode = 2468\n", {"Kiosk.Code", "lumora --kiosk-code"}},
         {"[Drives]\nOrder = EDE\n", {"Drives.Order", "once"}},
         {"[Drives]\nProgramLetter = Z\n", {"Drives.ProgramLetter"}},
         {"[Drives]\nDataFolder = here\n", {"Drives.DataFolder"}},

@@ -75,10 +75,12 @@ class RecordedShell : public Shell {
 public:
     void openWebPage(const QString& url) override { webPages += url; }
     void openFolder(const DrivePath& folder) override { folders += folder.text(); }
-    void copyToClipboard(const QString&) override {}
+    void copyToClipboard(const QString& text) override { clipboard = text; }
+    void clearClipboard() override { clipboard.clear(); }
 
     QStringList webPages;
     QStringList folders;
+    QString clipboard;
 };
 
 class FixedVolume : public Volume {

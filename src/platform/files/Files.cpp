@@ -224,6 +224,17 @@ Result<qint64> Files::size(const DrivePath& path) const {
     return static_cast<qint64>(status.st_size);
 }
 
+Result<qint64> Files::freeBytes(const DrivePath& folder) const {
+    const auto found = host(folder);
+    if (!found)
+        return found.failure();
+    std::error_code error;
+    const std::filesystem::space_info space = std::filesystem::space(*found, error);
+    if (error)
+        return systemFailure(error.value(), folder.text());
+    return static_cast<qint64>(space.available);
+}
+
 QStringList Files::names(const DrivePath& folder, const QString& patterns) const {
     QStringList names = storedNames(folder, patterns);
     for (QString& name : names)

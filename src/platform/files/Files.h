@@ -48,6 +48,8 @@ public:
     Result<void> keepCopy(const DrivePath& source, const DrivePath& target) const;
 
     Result<qint64> size(const DrivePath& path) const;
+    // What a file in the folder may still take, in bytes.
+    Result<qint64> freeBytes(const DrivePath& folder) const;
 
     // Leaf names of the files that match one of the patterns, separated by ";" ("*.gbr;*.jpp"); "*.*" and "*" match
     // all. Letter case does not count. Hidden files (a leading dot) and folders are left out. Sorted without regard to

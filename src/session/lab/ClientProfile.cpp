@@ -52,6 +52,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.OperatorArea = deployment.OperatorArea;
     state.Waiting = deployment.Waiting;
     state.screenKeys = deployment.screenKeys;
+    state.kiosk = deployment.kiosk;
     state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "common/DoorRules.h"
+#include "common/KioskRules.h"
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
@@ -38,6 +39,7 @@ struct Deployment {
     ScreenKeys screenKeys = ScreenKeys::Never;
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;
+    KioskRules kiosk;
 
     QChar programLetter = u'C'; // letter of the program's own drive
     QString dataFolder;         // host folder behind it; empty: the user's data folder

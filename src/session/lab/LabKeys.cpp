@@ -29,6 +29,11 @@ auto at(bool DoorRules::*field) {
 }
 
 template <class T>
+auto at(T KioskRules::*field) {
+    return [field](D& d) -> T& { return d.kiosk.*field; };
+}
+
+template <class T>
 auto at(T MailAccount::*field) {
     return [field](D& d) -> T& { return d.profile.mail.*field; };
 }
@@ -82,12 +87,13 @@ Kind host(QString P::*field) {
             }};
 }
 
-template <class T>
-Kind number(T P::*field, int smallest, int largest) {
+template <class Where>
+Kind number(Where where, int smallest, int largest) {
     return {u"a whole number from %1 to %2"_s.arg(smallest).arg(largest), [=](D& d, const QString& value) {
                 if (!matches(value, u"[0-9]{1,6}"_s) || value.toInt() < smallest || value.toInt() > largest)
                     return false;
-                d.profile.*field = static_cast<T>(value.toInt());
+                auto& field = where(d);
+                field = static_cast<std::remove_reference_t<decltype(field)>>(value.toInt());
                 return true;
             }};
 }
@@ -181,8 +187,8 @@ std::vector<Row> rows() {
          words<FtpType>(at(&D::ftpType), u"A or I"_s, {{u"A"_s, FtpType::Ascii}, {u"I"_s, FtpType::Image}})},
         {"Server", "Session",
          words<bool>(at(&D::keptFtpSession), u"each or kept"_s, {{u"each"_s, false}, {u"kept"_s, true}})},
-        {"Server", "JppChunks", number(&P::JppChunks, 1, 32767)},
-        {"Server", "JppBase", number(&P::JppBase, 0, 32767)},
+        {"Server", "JppChunks", number(at(&P::JppChunks), 1, 32767)},
+        {"Server", "JppBase", number(at(&P::JppBase), 0, 32767)},
         {"Server", "JppTail", words<I>(at(&D::SugTzad), u"40 or 60"_s, {{u"40"_s, 40}, {u"60"_s, 60}})},
 
         {"Client", "Code", text(at(&P::ClientCode), u"1 to 32 letters, digits, - and _"_s, u"[A-Za-z0-9_-]{1,32}"_s)},
@@ -253,6 +259,13 @@ std::vector<Row> rows() {
          words<ScreenKeys>(
              at(&D::screenKeys), u"never, auto or always"_s,
              {{u"never"_s, ScreenKeys::Never}, {u"auto"_s, ScreenKeys::Touches}, {u"always"_s, ScreenKeys::Always}})},
+        {"Kiosk", "Mode", yesNo(at(&KioskRules::on), true, false)},
+        {"Kiosk", "IdleSeconds", number(at(&KioskRules::idleSeconds), 10, 3600)},
+        {"Kiosk", "Code",
+         text(at(&KioskRules::code), u"what \"lumora --kiosk-code\" prints, or empty"_s,
+              u"([0-9]{5,7}:[0-9a-f]{32}:[0-9a-f]{64})?"_s)},
+        {"Kiosk", "KeepDays", number(at(&KioskRules::keepDays), 1, 9999)},
+        {"Kiosk", "KeepLogDays", number(at(&KioskRules::keepLogDays), 1, 9999)},
 
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",
