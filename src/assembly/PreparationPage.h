@@ -41,6 +41,7 @@ public:
     // State
     const PreparationControls& controls() const override = 0;
     bool isPreparing() const { return m_preparing; }
+    bool isWorking() const override { return m_preparing; }
     // How far the work has come, 0 to 1, and the position and the count in words for a gauge.
     double share() const;
     QString positionText() const { return QString::number(m_position); }

@@ -178,6 +178,11 @@ void OrderJournal::countFiles(int sent, int inAll) {
     m_state.filesInAll = inAll;
 }
 
+void OrderJournal::markProven() {
+    m_kept = m_kept && m_state.proven;
+    m_state.proven = true;
+}
+
 Result<void> OrderJournal::arrived(bool byNameOnly) {
     makeKnown();
     OrderState next = m_state;
@@ -239,6 +244,12 @@ Result<void> OrderJournal::tried(const BothLanguages& why) {
     OrderState next = m_state;
     ++next.tries;
     next.why = why;
+    return keep(next);
+}
+
+Result<void> OrderJournal::lapsed() {
+    OrderState next = m_state;
+    next.lapsed = true;
     return keep(next);
 }
 

@@ -55,6 +55,8 @@ public:
     void countFiles(int sent, int inAll);
     // All files of the order lie on the server, none is in hand any more.
     Result<void> arrived(bool byNameOnly);
+    // The same, and each in its length: kept with the next step.
+    void markProven();
     // All files of the folder lie there. The log names more, and the customer has agreed to that.
     Result<void> arrivedAsAgreed();
     // Before report and done call, and after them. A begin that could not be kept has not taken place.
@@ -66,6 +68,8 @@ public:
     // A sending by itself has ended without the order's arrival; the staff wants no more of them.
     Result<void> tried(const BothLanguages& why);
     Result<void> givenUp();
+    // Its customer has gone.
+    Result<void> lapsed();
     // The order that this one was prepared again from is gone, or is one of its own.
     Result<void> replacesNone();
 

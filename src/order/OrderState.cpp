@@ -100,8 +100,12 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         return takeTruth(value, state.fewerAgreed);
     if (key == u"GivenUp")
         return takeTruth(value, state.givenUp);
+    if (key == u"Lapsed")
+        return takeTruth(value, state.lapsed);
     if (key == u"SentBefore")
         return takeTruth(value, state.sentBefore);
+    if (key == u"Proven")
+        return takeTruth(value, state.proven);
     if (key == u"ProvenByNameOnly")
         return takeTruth(value, state.provenByNameOnly);
     if (key == u"MisparHazmana")
@@ -160,6 +164,8 @@ QByteArray OrderState::write() const {
     if (sentBefore)
         writer.truth("SentBefore", true);
     writer.truth("ProvenByNameOnly", provenByNameOnly);
+    if (proven)
+        writer.truth("Proven", true);
     writer.word("Report", reports, report);
     if (phase == Phase::Sending && filesInAll > 0) {
         writer.text(u"FilesSent"_s, QString::number(filesSent));
@@ -172,6 +178,8 @@ QByteArray OrderState::write() const {
     }
     if (phase < Phase::Arrived && givenUp)
         writer.truth("GivenUp", true);
+    if (phase < Phase::Reported && lapsed)
+        writer.truth("Lapsed", true);
     for (const QString& path : filesInHand)
         writer.text(u"InHand"_s, path);
     if (!replaces.isEmpty())

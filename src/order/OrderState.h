@@ -51,6 +51,7 @@ struct OrderState {
     bool fewerAgreed = false;      // all files of its folder arrived; the customer agreed that the log names more
     bool sentBefore = false;       // first known by a resend; an older version has sent it
     bool provenByNameOnly = false; // the server told no lengths
+    bool proven = false;           // on a kiosk with Careful: each file lies there in its length
     int filesSent = 0;             // of a whole sending: answered well or found there, before the file in hand
     int filesInAll = 0;            // 0: not counted
     QStringList filesInHand;       // full paths whose put has begun and was not confirmed
@@ -59,6 +60,7 @@ struct OrderState {
     int tries = 0;
     BothLanguages why;
     bool givenUp = false; // the staff wants it sent by itself no more
+    bool lapsed = false;  // on a kiosk: its customer has gone, and it is offered to nobody
     QString replaces;     // folder name of the order that this one was prepared again from
     QStringList items;    // lines of the basket; kept until the sending begins
     QString keptIn;       // the folder of KeptPictures; empty without one; kept as long as the lines

@@ -10,7 +10,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 Result<void> writeHandOverFiles(const SessionState& state, const Files& files, const QStringList& lines, int index) {
-    const DrivePath folder = WorkspacePaths::root(state) / u"Tik4txt";
+    const DrivePath folder = WorkspacePaths::handOverTexts(state);
     Result<void> done = files.folderExists(folder) ? Result<void>() : files.makeFolder(folder);
     const auto write = [&](const QString& name, const QStringList& of) {
         if (done)

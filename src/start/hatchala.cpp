@@ -22,9 +22,11 @@ hatchala::hatchala(SessionState& state, const Platform& platform, PageChain& cha
                {15, [this] { moveArrow(); }}} {}
 
 void hatchala::load() {
+    m_state.DiskRoot = m_platform.files.drives().programRoot();
+    if (m_deployment.kiosk.on)
+        endCustomer();
     m_state.EnglishTips = 0;
     m_state.SugTzad = m_deployment.SugTzad;
-    m_state.DiskRoot = m_platform.files.drives().programRoot();
     loadProfile();
     offerUnfinished();
     setTexts();
@@ -42,6 +44,10 @@ void hatchala::setEnglish(bool english) {
     m_state.EnglishTips = english ? 1 : 0;
     List1.clear();
     setTexts();
+}
+
+bool hatchala::isUntouched() const {
+    return !m_state.english() && !m_state.staff && !Pic4Hemshech.visible && !Picture1.visible && !Notice.visible;
 }
 
 // --- leaving the page ---

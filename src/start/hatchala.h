@@ -44,12 +44,15 @@ struct hatchalaControls : Controls {
     Caption Image2{*this, u"Image2"};                          // the same
     Caption Picture3{*this, u"Picture3", Caption::At::Hidden}; // the line above a help picture
     ControlArray<Caption, 6> Image12{*this, u"Image12", Caption::At::Hidden}; // help pictures by Hover, from index 1
-    Caption Pic4Hemshech{*this, u"Pic4Hemshech", Caption::At::Hidden};     // the panel that offers an unfinished order
-    Caption Label4Hemshech{*this, u"Label4Hemshech"};                      // its number, and how far it came
-    Caption Label4Od{*this, u"Label4Od", Caption::At::Hidden};             // how many more there are
-    Caption Command4Hemshech{*this, u"Command4Hemshech"};                  // goes on with it
-    Caption Command4Achar{*this, u"Command4Achar"};                        // puts it off
-    Caption Command4Bitul{*this, u"Command4Bitul"};                        // throws it away
+    Caption Pic4Hemshech{*this, u"Pic4Hemshech", Caption::At::Hidden}; // the panel that offers an unfinished order
+    Caption Label4Hemshech{*this, u"Label4Hemshech"};                  // its number, and how far it came
+    Caption Label4Od{*this, u"Label4Od", Caption::At::Hidden};         // how many more there are
+    Caption Command4Hemshech{*this, u"Command4Hemshech"};              // goes on with it
+    Caption Command4Achar{*this, u"Command4Achar"};                    // puts it off
+    Caption Command4Bitul{*this, u"Command4Bitul"};                    // throws it away
+    Caption Label4Sfarot{*this, u"Label4Sfarot", Caption::At::Hidden}; // on a kiosk: the digits typed so far
+    ControlArray<Caption, 10> Command4Sifra{*this, u"Command4Sifra", Caption::At::Hidden}; // the digits
+    Caption Command4Mehak{*this, u"Command4Mehak", Caption::At::Hidden};                   // takes one back
     Caption Label4Mamtinot{*this, u"Label4Mamtinot", Caption::At::Hidden}; // for the staff: how many orders wait
     DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
@@ -105,6 +108,8 @@ public:
     void Command4Hemshech_Click() { goOnWithOrder(); }
     void Command4Achar_Click() { putOffOrder(); }
     void Command4Bitul_Click() { throwOrderAway(); }
+    void Command4Sifra_Click(int digit) { typeDigit(digit); }
+    void Command4Mehak_Click() { takeDigitBack(); }
     // The control under the mouse or the finger, or with the keyboard focus; Nothing for a control without help.
     enum class Hover { Nothing, Image1, Image11, Image5, Image3, Image6 };
     void MouseMove(Hover over) { showHelp(over); }
@@ -135,6 +140,8 @@ public:
     // --- state ---
 
     const hatchalaControls& controls() const override { return *this; }
+    bool isUntouched() const override;
+    void leftAlone() override; // an offer that nobody took up lapses
     Hover hover() const { return m_over; }
     const StartMotion& motion() const { return m_motion; }
     const hatchalaTimers& timers() const { return m_timers; }
@@ -165,10 +172,16 @@ private:
     void offerUnfinished();
     void readUnfinished();
     void showOffer();
+    void showDigits();
     void showWaiting();
     void goOnWithOrder();
     void putOffOrder();
     void throwOrderAway();
+    bool anotherRuns() const;
+    void endCustomer();
+    bool asksForDigits() const;
+    void typeDigit(int digit);
+    void takeDigitBack();
     bool asksToThrowAway(const QString& number);
     QString offerText(const UnfinishedOrder& order) const;
 
@@ -194,6 +207,9 @@ private:
     StartMotion m_motion;
     Hover m_over = Hover::Nothing;
     QList<UnfinishedOrder> m_unfinished; // the first one is offered
+    bool m_recognised = false;           // on a kiosk: the customer of the first one has given the digits
+    QString m_digits;                    // typed so far
+    int m_wrongDigits = 0;               // times in a row
     bool m_asksForGone = false;          // the panel asks whether to go on without the pictures that are gone
     int m_secondsLeft = 5;               // of the countdown
     bool m_leaving = false;

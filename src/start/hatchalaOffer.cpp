@@ -1,4 +1,7 @@
 // The panel of the start page that offers an order which was not finished.
+#include "common/Warning.h"
+#include "order/CustomerTraces.h"
+#include "order/KioskOffer.h"
 #include "order/WaitingOrders.h"
 #include "platform/Dialogs.h"
 #include "platform/Instances.h"
@@ -13,9 +16,39 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+constexpr int mostWrongDigits = 3; // then the panel closes
+
+void warnOf(const Result<void>& done, const QString& what) {
+    if (!done)
+        writeWarning(what.arg(done.failure().message));
+}
+
+} // namespace
+
+// The customer before has gone.
+void hatchala::endCustomer() {
+    warnOf(CustomerTraces(m_state, m_platform).clear(), u"what a customer has left can't be cleared: %1"_s);
+    if (anotherRuns())
+        return;
+    loadProfile(); // tells which orders can go on
+    warnOf(ThrowLapsedAway(UnfinishedOrders(m_state, m_platform.files), m_platform.files),
+           u"an order that nobody takes up can't be thrown away: %1"_s);
+}
+
+void hatchala::leftAlone() {
+    if (m_state.closedToCustomers())
+        warnOf(LetLapse(m_unfinished, m_platform.files), u"it can't be kept that nobody takes an order up: %1"_s);
+}
+
+bool hatchala::anotherRuns() const {
+    return m_platform.instances.another();
+}
+
 // An order that seems unfinished may be under way in another program.
 void hatchala::offerUnfinished() {
-    if (m_platform.instances.another())
+    if (anotherRuns())
         return;
     TidyOrders(m_state, m_platform.files);
     if (!m_state.offerPutOff)
@@ -26,6 +59,8 @@ void hatchala::offerUnfinished() {
 // What is sent by itself is no business of the next customer.
 void hatchala::readUnfinished() {
     m_unfinished = UnfinishedOrders(m_state, m_platform.files);
+    if (m_state.closedToCustomers())
+        m_unfinished = OfferedOnKiosk(m_unfinished, m_platform.files);
     if (!m_state.Waiting)
         return;
     const QList<UnfinishedOrder> waiting = OrdersThatWait(m_state, m_platform);
@@ -36,8 +71,34 @@ void hatchala::readUnfinished() {
     });
 }
 
+bool hatchala::asksForDigits() const {
+    return m_state.closedToCustomers() && !m_recognised;
+}
+
+void hatchala::typeDigit(int digit) {
+    if (m_leaving || !Pic4Hemshech.visible || !asksForDigits())
+        return;
+    m_digits += QString::number(digit);
+    if (m_digits.size() == telephoneEnd) {
+        const QString digits = std::exchange(m_digits, {});
+        const auto isIt = [&](const UnfinishedOrder& order) { return IsEndOfTelephone(order.state, digits); };
+        const auto order = std::find_if(m_unfinished.begin(), m_unfinished.end(), isIt);
+        m_recognised = order != m_unfinished.end();
+        if (m_recognised)
+            m_unfinished = {UnfinishedOrder(*order)};
+        else if (++m_wrongDigits == mostWrongDigits)
+            return putOffOrder();
+    }
+    showOffer();
+}
+
+void hatchala::takeDigitBack() {
+    m_digits.chop(1);
+    showOffer();
+}
+
 void hatchala::goOnWithOrder() {
-    if (m_leaving || !Pic4Hemshech.visible)
+    if (m_leaving || !Pic4Hemshech.visible || asksForDigits())
         return;
     // Pictures may have gone or come back, with their card, since the panel opened.
     UnfinishedOrder& order = m_unfinished.first();
@@ -58,6 +119,7 @@ void hatchala::putOffOrder() {
         return;
     // Waiting for the pictures leads back to the offer.
     if (!std::exchange(m_asksForGone, false)) {
+        leftAlone();
         m_state.offerPutOff = true;
         m_unfinished.clear();
     }
@@ -65,7 +127,7 @@ void hatchala::putOffOrder() {
 }
 
 void hatchala::throwOrderAway() {
-    if (m_leaving || !Pic4Hemshech.visible)
+    if (m_leaving || !Pic4Hemshech.visible || asksForDigits())
         return;
     const UnfinishedOrder order = m_unfinished.first();
     if (!asksToThrowAway(order.state.number) || m_leaving)
@@ -73,6 +135,7 @@ void hatchala::throwOrderAway() {
     if (const Result<void> gone = ThrowAwayOrder(m_platform.files, order.folder); !gone)
         m_platform.dialogs.message(gone.failure().message);
     m_asksForGone = false;
+    m_recognised = false;
     readUnfinished();
     showOffer();
 }

@@ -1,4 +1,5 @@
 // The wording of the start page, in both languages.
+#include "order/KioskOffer.h"
 #include "platform/Dialogs.h"
 #include "session/CaptionTexts.h"
 #include "session/SessionState.h"
@@ -46,6 +47,8 @@ void hatchala::setTexts() {
                 });
     Image8.text = QUrl(m_state.profile.SiteUrl).host();
     Label3.visible = Label4.visible = m_state.english();
+    Image3.visible = !m_state.closedToCustomers();
+    Label4.visible = Label4.visible && Image3.visible;
     setHelp();
     showOffer();
     showWaiting();
@@ -63,6 +66,15 @@ void hatchala::showOffer() {
     Q_EMIT changed();
     if (m_unfinished.isEmpty())
         return;
+    const bool digits = asksForDigits();
+    Command4Hemshech.visible = Command4Bitul.visible = !digits;
+    Label4Sfarot.visible = Command4Mehak.visible = digits;
+    for (Caption& digit : Command4Sifra)
+        digit.visible = digits;
+    if (digits) {
+        showDigits();
+        return;
+    }
     const UnfinishedOrder& order = m_unfinished.first();
     Command4Hemshech.enabled = !m_asksForGone || !order.lacksAllPictures();
     setCaptions(m_state, {
@@ -74,6 +86,22 @@ void hatchala::showOffer() {
     Label4Od.visible = !m_asksForGone && m_unfinished.size() > 1;
     Label4Od.text = m_state.wording(u"ועוד הזמנות שלא הושלמו: %1", u"More orders that were not finished: %1")
                         .arg(m_unfinished.size() - 1);
+}
+
+// Nothing here tells whose order it is.
+void hatchala::showDigits() {
+    setCaptions(m_state,
+                {
+                    {Command4Achar, u"זו לא ההזמנה שלי", u"It is not my order"},
+                    {Label4Hemshech, u"זו ההזמנה שלכם? הקישו את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
+                     u"Is it yours? Type the last three digits of the telephone number of the order."},
+                    {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not fit. Please try again."},
+                    {Command4Mehak, u"מחק ספרה", u"Take a digit back"},
+                });
+    Label4Od.visible = m_wrongDigits > 0 && m_digits.isEmpty();
+    Label4Sfarot.text = m_digits.leftJustified(telephoneEnd, u'_').split(QString(), Qt::SkipEmptyParts).join(u' ');
+    for (std::size_t i = 0; i < Command4Sifra.size(); ++i)
+        Command4Sifra[i].text = QString::number(i);
 }
 
 QString hatchala::offerText(const UnfinishedOrder& order) const {

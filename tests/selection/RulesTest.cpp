@@ -3,10 +3,13 @@
 #include "selection/CardWords.h"
 #include "selection/CopiesEntry.h"
 #include "selection/FolderPager.h"
+#include "selection/OrderSpace.h"
 #include "selection/PictureChoice.h"
 #include "selection/PrintQuality.h"
 #include "session/SessionState.h"
-#include "support/DrivePathLiteral.h"
+#include "support/PageRig.h"
+
+#include <QRegularExpression>
 
 #include <gtest/gtest.h>
 
@@ -320,6 +323,22 @@ TEST(ACard, isOfferedInTheWordsOfItsLanguage) {
             EXPECT_EQ(words.opens, card && card->pictures > 0);
         }
     }
+}
+
+TEST(OrderSpace, IsReckonedByPaperOrPictureAndToldInFigures) {
+    PageRig rig;
+    rig.write(u"C:\\large.jpg"_path, "x");
+    std::filesystem::resize_file(rig.host(u"C:\\large.jpg"_s), 90000000);
+    SessionState state;
+    state.Optint = OrderKind::Print;
+    const auto needed = [&](const QString& line) {
+        return OrderSpace::neededFor({line, line}, state, rig.machine.files) -
+               OrderSpace::neededFor({line}, state, rig.machine.files);
+    };
+    EXPECT_EQ(needed(u"1 1015GNBC:\\large.jpg"_s), 90000000);
+    EXPECT_NEAR(needed(u"1 3045GNBC:\\gone.jpg"_s), 9 * needed(u"1 1015GNBC:\\gone.jpg"_s), 9);
+    EXPECT_FALSE(OrderSpace::words(state, 1000, 1000));
+    EXPECT_TRUE(OrderSpace::words(state, 240000001, 80999999)->contains(QRegularExpression(u"241.* 80"_s)));
 }
 
 } // namespace

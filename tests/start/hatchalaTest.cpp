@@ -173,6 +173,67 @@ TEST_F(hatchalaTest, OffersAnOrderThatWasNotFinished) {
     EXPECT_FALSE(start().controls().Pic4Hemshech.visible) << "later is for the whole run";
 }
 
+TEST_F(hatchalaTest, OffersAnOrderOnAKioskToWhoKnowsItsTelephoneAndForAWhile) {
+    deployment.kiosk.on = true;
+    chain.registerPage(PageId::Form2, [] { return std::make_unique<Page>(PageId::Form2); });
+    const auto give = [&](const QString& number, OrderState::Phase phase) {
+        const OrderFolder folder(u"C:\\2000lumora\\!!000"_path / (u"2026_11_21_KUP_1234^"_s + number));
+        std::filesystem::create_directories(*machine.drives.toHost(folder.path()));
+        OrderState order;
+        order.phase = phase;
+        order.number = number;
+        order.kind = OrderKind::Print;
+        order.items = {u"1 1015GNBC:\\pics\\one.jpg"_s};
+        order.choices = {{u"Shemot.n2"_s, u"03-1234"_s + number}};
+        EXPECT_TRUE(WriteOrderState(machine.files, folder, order));
+        EXPECT_TRUE(machine.files.writeWhole(folder.filePath(u"1 1015GNB0000_016F6E65.jpp"_s), "print"));
+        return folder;
+    };
+    hatchala* page = nullptr;
+    const auto again = [&]() -> const hatchalaControls& {
+        chain.unload(chain.front()->id());
+        page = static_cast<hatchala*>(chain.front());
+        return page->controls();
+    };
+    const auto type = [&](std::initializer_list<int> digits) {
+        for (const int digit : digits)
+            page->Command4Sifra_Click(digit);
+    };
+    const auto isThere = [&](const OrderFolder& order) { return machine.files.folderExists(order.path()); };
+    const OrderFolder preparing = give(u"105"_s, OrderState::Phase::Preparing);
+    const OrderFolder prepared = give(u"106"_s, OrderState::Phase::Prepared);
+    const OrderFolder guessed = give(u"107"_s, OrderState::Phase::Sending);
+    EXPECT_TRUE(machine.files.writeWhole(guessed.statePath(), "damaged"));
+
+    page = &start();
+    const hatchalaControls* c = &page->controls();
+    EXPECT_FALSE(c->Image3.visible || c->Command4Hemshech.visible || page->isUntouched());
+    page->Command4Hemshech_Click();
+    page->Command4Bitul_Click();
+    type({1, 0});
+    page->Command4Mehak_Click();
+    EXPECT_EQ(c->Label4Sfarot.text, u"1 _ _");
+    type({0, 5});
+    EXPECT_TRUE(c->Label4Hemshech.text.contains(u"105"_s)) << "not the newest, but the one of these digits";
+    page->Command4Hemshech_Click();
+    ASSERT_EQ(chain.front()->id(), PageId::Form2);
+
+    c = &again();
+    type({1, 0, 7, 1, 0, 8});
+    EXPECT_TRUE(c->Label4Od.visible && c->Pic4Hemshech.visible);
+    type({1, 0, 9});
+    EXPECT_FALSE(c->Pic4Hemshech.visible) << "nobody tries on";
+    EXPECT_TRUE(isThere(preparing));
+    EXPECT_FALSE(again().Pic4Hemshech.visible || isThere(preparing));
+    EXPECT_TRUE(isThere(prepared) && isThere(guessed) && page->isUntouched());
+
+    const OrderFolder left = give(u"108"_s, OrderState::Phase::Preparing);
+    EXPECT_TRUE(again().Pic4Hemshech.visible && isThere(left));
+    page->leftAlone();
+    again();
+    EXPECT_FALSE(isThere(left));
+}
+
 TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
     deployment.DeliveryChoiceMode = 1;
     deployment.profile.LabPhone = u"09-9"_s;
@@ -202,15 +263,6 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
         EXPECT_EQ(seenByTheDetails, c.seen);
         chain.unload(PageId::nnn);
     }
-}
-
-TEST_F(hatchalaTest, OpensTheWebPagesWithTheLabsAddresses) {
-    hatchala& page = start();
-    state.profile.SiteUrl = u"changed"_s;
-    page.Image11_Click();
-    page.Image8_Click();
-    EXPECT_EQ(machine.shell.webPages,
-              QStringList({"http://www.lumora.example/album_pricelist", "http://www.lumora.example/"}));
 }
 
 TEST_F(hatchalaTest, TheAdvertisingPictureComesFromTheSiteOrTheInstallationAndMoves) {

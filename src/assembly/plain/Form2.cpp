@@ -77,8 +77,9 @@ void Form2::prepare() {
         askWithoutPrints();
     if (!made)
         return;
-    const bool toFinishedOrders =
-        !m_state.TachanaMekomit && m_state.TmunatPaar == 1 && m_state.Optint == OrderKind::Sequence;
+    const bool toFinishedOrders = !m_state.TachanaMekomit && m_state.TmunatPaar == 1 &&
+                                  m_state.Optint == OrderKind::Sequence &&
+                                  !m_state.closedToCustomers(); // that page lists the orders of others
     if (toFinishedOrders && m_chain.canFollow(id(), Outcome::PreparedForLater))
         m_state.handOver.lines = {m_state.transfer.OrderLogBase.text()};
     handOver(toFinishedOrders ? Outcome::PreparedForLater : Outcome::PreparedForFtp);

@@ -122,7 +122,7 @@ void AlbumPanels::leavePhotographer() {
     }
     if (!isWhole())
         return;
-    if (Check5.checked) {
+    if (Check5.checked && !m_state.kiosk.on) {
         const Result<void> saved =
             DetailStore(m_state, m_platform.files).SaveAlbumDetails({Text1[0].text, Text1[1].text, Text1[3].text});
         // The order goes on even if the details can't be stored.

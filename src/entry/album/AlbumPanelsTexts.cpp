@@ -109,6 +109,8 @@ void AlbumPanels::showPanel() {
         for (Caption* part : row.parts)
             part->visible = Pic4Alboom.visible && row.panel == m_panel;
     }
+    if (m_state.kiosk.on)
+        Check5.visible = Command28.visible = false;
     for (Caption* part :
          std::initializer_list<Caption*>{&LabelParents, &Label32, &Command26, &Command27, &Combo4Horim, &Label36})
         part->visible = Check4.visible && Check4.checked;

@@ -11,9 +11,10 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-const QString customerStore = u"pratim.txt"_s;
-const QString albumStore = u"pratim2.txt"_s;
-const QString quickStore = u"pratim3.txt"_s;
+// In the order of WorkspacePaths::detailStores().
+constexpr std::size_t customerStore = 0;
+constexpr std::size_t albumStore = 1;
+constexpr std::size_t quickStore = 2;
 
 // A line of up to four characters has at most two between its quotes: no name, no number.
 QString albumField(const QStringList& lines, int index) {
@@ -70,15 +71,15 @@ Result<void> DetailStore::forgetQuickDetails() const {
     return forget(quickStore);
 }
 
-DrivePath DetailStore::path(const QString& name) const {
-    return WorkspacePaths::root(m_state) / name;
+DrivePath DetailStore::path(std::size_t store) const {
+    return WorkspacePaths::detailStores(m_state)[store];
 }
 
 // Splits at line ends alone, since a name may hold a single quote mark, as Hebrew abbreviations do.
-Result<std::optional<QStringList>> DetailStore::lines(const QString& name) const {
-    if (!m_files.fileExists(path(name)))
+Result<std::optional<QStringList>> DetailStore::lines(std::size_t store) const {
+    if (!m_files.fileExists(path(store)))
         return std::optional<QStringList>();
-    const Result<QByteArray> bytes = m_files.read(path(name));
+    const Result<QByteArray> bytes = m_files.read(path(store));
     if (!bytes)
         return bytes.failure();
     QString text = AnsiCodePage::decode(*bytes);
@@ -88,10 +89,10 @@ Result<std::optional<QStringList>> DetailStore::lines(const QString& name) const
     return std::optional(text.split(u'\n'));
 }
 
-Result<void> DetailStore::forget(const QString& name) const {
-    if (!m_files.fileExists(path(name)))
+Result<void> DetailStore::forget(std::size_t store) const {
+    if (!m_files.fileExists(path(store)))
         return {};
-    return m_files.removeFile(path(name));
+    return m_files.removeFile(path(store));
 }
 
 } // namespace lumora

@@ -5,6 +5,7 @@
 
 #include <QString>
 
+#include <cstddef>
 #include <optional>
 
 namespace lumora {
@@ -45,9 +46,9 @@ public:
     Result<void> forgetQuickDetails() const;
 
 private:
-    DrivePath path(const QString& name) const;
-    Result<std::optional<QStringList>> lines(const QString& name) const;
-    Result<void> forget(const QString& name) const;
+    DrivePath path(std::size_t store) const;
+    Result<std::optional<QStringList>> lines(std::size_t store) const;
+    Result<void> forget(std::size_t store) const;
 
     const SessionState& m_state;
     const Files& m_files;

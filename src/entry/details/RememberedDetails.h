@@ -5,7 +5,7 @@
 namespace lumora {
 
 // Keeps or forgets a customer's details as the box "remember" says. As built in they are stored before the options
-// whatever it says, and an album order stores or deletes them too, though it asks for none.
+// whatever it says, and an album order stores or deletes them too, though it asks for none. On a kiosk nothing is kept.
 class RememberedDetails {
 public:
     RememberedDetails(const SessionState& state, const Files& files)

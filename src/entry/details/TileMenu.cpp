@@ -40,6 +40,8 @@ std::array<bool, TileCount> visibleTiles(const SessionState& state) {
         visible[QuickTile] = false;
     if (state.Careful)
         visible[NothingTile] = false;
+    if (state.closedToCustomers())
+        visible[MailTile] = false;
     return visible;
 }
 

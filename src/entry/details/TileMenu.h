@@ -25,7 +25,7 @@ enum TileIndex {
 
 // Which tiles a client sees, by its letter; a letter that is not known has all the ordinary tiles. Then the switches:
 // TmunatPaar 1 adds the restart tile, MinuyPaar 2 takes the quick order away, and with Careful the tile that does
-// nothing is gone.
+// nothing is gone. On a kiosk the finished orders are the staff's.
 std::array<bool, TileCount> visibleTiles(const SessionState& state);
 
 // The kind of order that the tile begins, or the mode that it leaves in Optint; NotChosen for the others.

@@ -99,7 +99,9 @@ void nnn::showStep() {
     for (std::size_t i = 0; i < Image1.size(); ++i)
         Image1[i].visible = menu && tiles[i];
     Command4Ivrit.visible = menu && m_state.english();
-    Command14.visible = menu && m_state.MinuyPaar != 2;
+    Command14.visible = menu && m_state.MinuyPaar != 2 && !m_state.closedToCustomers();
+    if (m_state.kiosk.on)
+        Check2.visible = Command10.visible = false;
     Command2.visible = Command4.visible = !menu;
     Command7.visible = Command9.visible = Frame1.visible;
     LabelText4.visible = Text4.visible = m_step == Step::Details && m_state.MishloachHabaita;

@@ -45,6 +45,8 @@ void nnn::setTexts() {
         Image1[i].text = m_state.wording(text.hebrew, text.english);
         Image1[i].hint = m_state.wording(text.hebrewHint, text.englishHint);
     }
+    if (m_state.closedToCustomers())
+        Image1[ExitTile].text = m_state.wording(u"לדף הפתיחה", u"To the first page");
     m_quickSizes = m_state.profile.QuickSizes;
     for (std::size_t i = 0; i < Option3.size(); ++i)
         Option3[i].text = paperKind(static_cast<int>(i));

@@ -13,7 +13,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 void MoogMeret::listWaiting() {
-    m_waiting = m_state.OperatorArea ? OrdersThatWait(m_state, m_platform) : QList<UnfinishedOrder>();
+    m_waiting = m_state.mayOpenOperatorArea() ? OrdersThatWait(m_state, m_platform) : QList<UnfinishedOrder>();
     List4Mamtinot.clear();
     for (const UnfinishedOrder& order : std::as_const(m_waiting))
         List4Mamtinot.append(waitingRow(order));

@@ -127,6 +127,7 @@ public:
     // --- state ---
 
     const kyoskNewControls& controls() const override { return *this; }
+    bool isWorking() const override { return m_wait.waits(); } // goes on with the order by itself
     // Pictures are chosen as they are, and not edited.
     bool plain() const;
     // The cell whose picture is open in the editor, or -1.

@@ -6,6 +6,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/HomeAddress.h"
+#include "selection/OrderSpace.h"
 #include "selection/door/PictureDoor.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/PageChain.h"
@@ -238,6 +239,12 @@ void kyoskNew::typeAlbumMail(const QString& text) {
 void kyoskNew::handOver(const QString& mail) {
     if (m_handedOver || !homeAddressKnown())
         return;
+    if (m_state.kiosk.on) {
+        if (const std::optional<QString> lacking = OrderSpace::lacking(List1.items(), m_state, m_platform.files)) {
+            m_platform.dialogs.message(*lacking);
+            return;
+        }
+    }
     m_handedOver = true;
     m_state.handOver.closing = {Text1.text, Combo1.text, Combo1Index, m_promptStands, Text2.text};
     m_state.handOver.details = m_state.shemot;
