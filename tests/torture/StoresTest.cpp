@@ -6,6 +6,7 @@
 #include "entry/details/DetailStore.h"
 #include "finished/pieces/Mod4split.h"
 #include "imaging/files/PictureFile.h"
+#include "kiosk/OrderKeeping.h"
 #include "order/BrokenFiles.h"
 #include "order/OrderFolder.h"
 #include "order/OrderState.h"
@@ -27,6 +28,7 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
     const DetailStore details(state, files);
     const Mod4split pieces(files, [](int, int) { return true; });
     state.MisparHazmana = u"105"_s;
+    state.kiosk.on = true;
     TextList broken;
     broken.append(picture.text());
     makeFolder(root);
@@ -60,6 +62,7 @@ TEST_F(StoresOnAFailingDisk, HoldTheOldContentOrTheNewAndTellEachFailure) {
              const auto made = DoorDecoder({}).make(upright, behindTheDoor);
              return made ? Result<void>() : made.failure();
          }},
+        {u"C:\\vedron\\keeping.txt"_path, [&] { return OrderKeeping(state, machine.platform).look(); }},
         {root / u"copy", [&] { return files.copyFile(piece, root / u"copy"); }},
         {root / u"b_jpp_003_003.prk",
          [&] {

@@ -23,7 +23,7 @@ QStringList OrderSummaryLines(const SessionState& state, const QDate& date) {
     if (resend)
         lines += state.wording(u" משלוח חוזר "_s, u" Resend "_s);
     // The button that these lines name opens the operator's area.
-    if (resend && state.OperatorArea)
+    if (resend && state.mayOpenOperatorArea())
         lines += {state.wording(u" כדי לראות פרטי הזמנה לחץ על "_s, u" To see the order's details press "_s),
                   state.wording(u" הצג יותר פרטים "_s, u" Show more details "_s)};
     if (!resend)

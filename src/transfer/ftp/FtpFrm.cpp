@@ -36,7 +36,6 @@ void FtpFrm::load() {
     chkPassive.checked = true;
     optBin.checked = true;
     Command22.visible = m_state.transfer.SugMishloah == Sending::Chain;
-    Command24.visible = m_state.OperatorArea;
     FtpEnableControls(false);
     showSeconds();
     Timer2.start();
@@ -283,6 +282,8 @@ void FtpFrm::leaveForAnother() {
 }
 
 void FtpFrm::openOrderFolder() {
+    if (m_state.closedToCustomers())
+        return;
     Command12.enabled = false;
     m_platform.shell.copyToClipboard({});
     m_platform.shell.copyToClipboard(m_state.MisparHazmana);
@@ -292,7 +293,7 @@ void FtpFrm::openOrderFolder() {
 }
 
 void FtpFrm::showLabArea(bool shown) {
-    Frame2.visible = shown && m_state.OperatorArea;
+    Frame2.visible = shown && m_state.mayOpenOperatorArea();
     Q_EMIT changed();
 }
 

@@ -141,6 +141,9 @@ void FtpFrm::showMinutes() {
 }
 
 void FtpFrm::setTexts() {
+    Command24.visible = m_state.mayOpenOperatorArea();
+    if (m_state.kiosk.on)
+        Image4.visible = m_state.staff && phase() != SendingPhase::Success;
     setCaptions(
         m_state,
         {{Command12, u"שלח ", u"Send "},

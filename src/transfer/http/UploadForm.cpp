@@ -31,10 +31,6 @@ UploadForm::UploadForm(SessionState& state, const Platform& platform, PageChain&
     showAnswers();
 }
 
-void UploadForm::load() {
-    Command24.visible = m_state.OperatorArea;
-}
-
 void UploadForm::begin() {
     Timer4Line.start();
     refreshList();

@@ -17,7 +17,6 @@ public:
 
     UploadForm(SessionState& state, const Platform& platform, PageChain& chain);
 
-    void load() override;
     void setTexts() override;
 
     // Events.

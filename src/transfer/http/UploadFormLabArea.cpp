@@ -27,7 +27,7 @@ void UploadForm::setLabTexts() {
 }
 
 void UploadForm::showLabArea(bool shown) {
-    Frame2.visible = shown && m_state.OperatorArea;
+    Frame2.visible = shown && m_state.mayOpenOperatorArea();
     Q_EMIT changed();
 }
 

@@ -150,6 +150,7 @@ void UploadForm::showAnswers() {
 }
 
 void UploadForm::setTexts() {
+    Command24.visible = m_state.mayOpenOperatorArea();
     setCaptions(m_state, {{Command2, u"רענן רשימה", u"Refresh list"},
                           {Command3, u"עצור את המשלוח", u"Stop the sending"},
                           {Command10, u"המשך את המשלוח", u"Continue the sending"},

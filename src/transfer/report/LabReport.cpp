@@ -32,6 +32,8 @@ void LabReport::keepArrival(Arrival arrival, SendingPhase end, bool byNameOnly) 
         return;
     if (arrival == Arrival::Part)
         return;
+    if (m_state.kiosk.on && m_state.Careful && arrival == Arrival::Whole && !byNameOnly)
+        m_order->markProven();
     m_keep(arrival == Arrival::Agreed ? m_order->arrivedAsAgreed() : m_order->arrived(byNameOnly));
     if (end == SendingPhase::AllThere)
         endUntold();
