@@ -4,6 +4,9 @@
 #include "app/PageRegister.h"
 #include "common/HostFile.h"
 #include "common/Warning.h"
+#include "kiosk/IdleEnd.h"
+#include "kiosk/OrderKeeping.h"
+#include "kiosk/StaffCode.h"
 #include "platform/ForwardCall.h"
 #include "platform/Instances.h"
 #include "platform/NetworkCards.h"
@@ -21,6 +24,7 @@
 #include "session/SessionState.h"
 #include "session/lab/LabFile.h"
 #include "transfer/waiting/WaitingSending.h"
+#include "views/window/KioskPanels.h"
 #include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
 
@@ -69,13 +73,30 @@ struct Program::Parts {
         , dialogs(window, state, files, cards, clock)
         , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
                    cards, doorProgram()}
-        , waiting(state, platform, chain, deployment) {
+        , waiting(state, platform, chain, deployment)
+        , idle(deployment.kiosk, platform, chain)
+        , staffCode(state, files, clock)
+        , keeping(state, platform)
+        , kioskPanels(window, state, chain, idle, staffCode) {
+        // A browser would lie over the pages, and shows the files of this machine.
+        shell.mayOpen = [this] {
+            if (state.closedToCustomers())
+                dialogs.message(state.wording(u"במכשיר זה אין גלישה באתרים.", u"This machine opens no web pages."));
+            return !state.closedToCustomers();
+        };
+        chain.mayEnd = [this] { return !state.closedToCustomers(); };
+        kioskPanels.staffCameIn = [this] {
+            dialogs.message(state.wording(u"כלי הצוות פתוחים עד שיחזור דף הפתיחה.",
+                                          u"The staff's tools are open until the start page comes anew."));
+        };
         // A medium has its letter before any page hears what it holds.
         cards.setLook([this, roots = drives.mediaRoots()]() -> std::function<void()> {
             return [this, found = Drives::findMedia(roots)] { drives.giveLetters(found); };
         });
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
+            if (state.closedToCustomers())
+                return true; // the start page comes
             const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);
             return dialogs.ask(choosing ? state.wording(u"לצאת מהתוכנה? הזמנה שעדיין לא נשלחה לא תישמר.",
                                                         u"Leave the program? An order that was not sent yet is lost.")
@@ -101,6 +122,10 @@ struct Program::Parts {
     ScreenDialogs dialogs;
     Platform platform;
     WaitingSending waiting;
+    IdleEnd idle;
+    StaffCode staffCode;
+    OrderKeeping keeping;
+    KioskPanels kioskPanels;
     std::optional<ForwardCalls> forwardCalls;
 };
 
@@ -179,6 +204,11 @@ Result<void> Program::start() {
                                       m_options.media ? m_options.media : systemMedia);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
+    QObject::connect(&parts.chain, &PageChain::shown, &parts.window, [&parts](const Page* page) {
+        const Result<void> kept = page->id() == PageId::hatchala ? parts.keeping.look() : Result<void>();
+        if (!kept)
+            writeWarning(u"an order that was kept long enough can't be removed: %1"_s.arg(kept.failure().message));
+    });
     registerViews(parts.window, parts.chain, parts.state, parts.files);
     // A question may run an event loop of its own; each of them has to return before the process ends.
     QObject::connect(

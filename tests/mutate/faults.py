@@ -18,7 +18,7 @@ SUITES = {
     'editing': ('editing', 'selection', 'assembly', 'scenarios', 'views'), 'selection': ('selection', 'scenarios', 'views'),
     'assembly': ('assembly', 'torture', 'scenarios'), 'transfer': ('transfer', 'internet', 'scenarios'),
     'finished': ('finished', 'integration_mail', 'scenarios', 'views'), 'entry': ('entry', 'scenarios', 'views'),
-    'start': ('start', 'scenarios', 'views'), 'views': ('views', 'drive'), 'app': ('drive', 'scenarios', 'views')}
+    'kiosk': ('kiosk', 'views'), 'start': ('start', 'scenarios', 'views'), 'views': ('views', 'drive'), 'app': ('drive', 'scenarios', 'views')}
 
 # Tests of the floor that are tried first for faults below a place, as --gtest_filter takes them; what survives them meets the whole suite.
 FIRST = {
@@ -252,7 +252,7 @@ FAULTS = {
         F('u"100"_s', 'u"1"_s', 'numbers begin at 1'),
         F('name.endsWith(ending) || name.endsWith(ending.toUpper())', 'true', 'files go that only look like scratch')],
     'src/session/lab/LabKeys.cpp': [
-        F('number(&P::JppChunks, 1, 32767)', 'number(&P::JppChunks, 0, 32767)', 'a lab may ask for prints of no piece'),
+        F('number(at(&P::JppChunks), 1, 32767)', 'number(at(&P::JppChunks), 0, 32767)', 'a lab may ask for prints of no piece'),
         F('FtpType::Image', 'FtpType::Ascii', 'a lab can not set the type I'),
         F('yesNo(at(&D::Careful), true, false)', 'yesNo(at(&D::Careful), false, false)', 'no guard can be set'),
         F('u"(?!00)[0-9]{2}/(?!00)[0-9]{2}"_s', 'u"[0-9]{2}/[0-9]{2}"_s', 'a paper of no width is offered')],
@@ -571,6 +571,29 @@ FAULTS = {
           told='with Careful no second program runs; built in the number is claimed by its folder'),
         F('!asksToThrowAway(order.state.number) || m_leaving', 'm_leaving', 'an order is thrown away without a question'),
         F('order.gone > 0 && (!m_asksForGone || order.lacksAllPictures())', 'false', 'an order goes on without its pictures')],
+
+    'src/order/CustomerTraces.cpp': [
+        F('name != u"door"', 'true', 'pictures that an unfinished order needs go with the scratch files'),
+        F('m_platform.shell.clearClipboard();', '', 'the clipboard is left to the next customer')],
+    'src/order/KioskOffer.cpp': [
+        F('digits.size() == telephoneEnd', 'true', 'no digit opens an order without a telephone'),
+        F('now.phase == OrderState::Phase::Preparing', 'true', 'a prepared order is thrown away'),
+        F('order.state.lapsed', 'false', 'an order is offered to whoever comes')],
+    'src/kiosk/IdleWatch.cpp': [
+        F('now() - m_since >= answerTime', 'true', 'the page goes as soon as the question has shown'),
+        F('silence == Silence::MayNotEnd || silence == Silence::NeedsNone', 'silence == Silence::NeedsNone',
+          'an order that is sent is cut')],
+    'src/kiosk/KioskDays.cpp': [
+        F('days >= 0 && days <= KioskDays::longestStep', 'days >= 0', 'a clock set to 2099 ages every order'),
+        F('doubts < daysUntilBelieved', 'false', 'a clock that jumps is believed at once')],
+    'src/kiosk/OrderKeeping.cpp': [
+        F('order.proven', 'true', 'prints of an order go that is not proven'),
+        F('!order.onlyReportIsLeft()', 'true', 'an order goes before the lab was told'),
+        F('day < 0 || day > m_days.lived', 'false', 'a damaged store ages an order')],
+    'src/kiosk/StaffCode.cpp': [
+        F('keep(m_wrong + 1);', '', 'a wrong code costs nothing'),
+        F('wrong > freeTries', 'wrong > freeTries + 1', 'the fifth wrong code costs nothing'),
+        F('isNumber && wrong >= 0', 'true', 'a damaged store lets anybody try on')],
 
     'src/app/Program.cpp': [
         F('reading.deployment.Careful ? Instances::Lock::Exclusive : Instances::Lock::Shared', 'Instances::Lock::Shared',

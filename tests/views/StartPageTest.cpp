@@ -101,6 +101,7 @@ TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
         }
         order.kind = OrderKind::Print;
         order.items = {u"1 1015GNBC:\\pics\\one.jpg"_s, u"1 1015GNBC:\\pics\\two.jpg"_s};
+        order.choices = {{u"Shemot.n2"_s, u"03-1234567"_s}};
         ASSERT_TRUE(WriteOrderState(walk.program().platform().files, folder, order));
     }
     PageChain& chain = walk.program().chain();
@@ -108,6 +109,13 @@ TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
     walk.settle();
     startPage(walk).Check1_Click(GetParam().english);
     look(walk, u"01-start-unfinished"_s);
+    state.kiosk.on = true;
+    chain.setAllTexts();
+    walk.go(u"Command4Sifra(1) Command4Sifra(2)"_s);
+    look(walk, u"01-start-digits"_s);
+    walk.press(u"hatchala"_s, u"Command4Sifra(3)"_s);
+    look(walk, u"01-start-digits-wrong"_s);
+    walk.go(u"Command4Sifra(5) Command4Sifra(6) Command4Sifra(7)"_s);
     walk.press(u"hatchala"_s, u"Command4Hemshech"_s);
     look(walk, u"01-start-unfinished-gone"_s);
     walk.press(u"hatchala"_s, u"Command4Achar"_s);

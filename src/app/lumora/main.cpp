@@ -1,3 +1,4 @@
+#include "app/CodePrompt.h"
 #include "app/Program.h"
 #include "imaging/PictureMemory.h"
 #include "session/lab/LabFile.h"
@@ -56,6 +57,8 @@ QString labFileHelp() {
 
 int main(int argc, char** argv) {
     keepPictureMemory();
+    if (std::any_of(argv + 1, argv + argc, [](const char* word) { return qstrcmp(word, "--kiosk-code") == 0; }))
+        return promptForStaffCode();
     // Help needs no screen.
     const auto asksForHelp = [](const char* word) {
         return QByteArrayList{"-h", "--help", "-v", "--version"}.contains(QByteArray(word));
@@ -73,7 +76,9 @@ int main(int argc, char** argv) {
     const QCommandLineOption lab(u"lab"_s, u"Read the lab's settings from FILE."_s, u"FILE"_s);
     const QCommandLineOption window(u"window"_s, u"Run in a window, not over the whole screen."_s);
     const QCommandLineOption area(u"operator"_s, u"Open the hidden area of the sending page, for the lab's people."_s);
-    parser.addOptions({help, version, lab, window, area});
+    const QCommandLineOption code(u"kiosk-code"_s,
+                                  u"Ask for the code of a kiosk's staff and print its line for lab.ini, [Kiosk]."_s);
+    parser.addOptions({help, version, lab, window, area, code});
     if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
         std::fprintf(stderr, "lumora: %s\n",
                      qPrintable(parser.errorText().isEmpty()

@@ -53,8 +53,8 @@ public:
 
     // The page has come to an end, or waits for an answer.
     bool hasEnded() const;
-    // Why, as the staff reads it: what the order lacks, or the reason that was told last, or the words of the phase.
     bool isWorking() const override { return !hasEnded(); }
+    // Why, as the staff reads it: what the order lacks, or the reason that was told last, or the words of the phase.
     BothLanguages whyItEnded() const;
     // Nothing is left to do but to begin a new order, or to send again. Then the page may be left where nobody is
     // there.

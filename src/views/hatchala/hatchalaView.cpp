@@ -1,6 +1,7 @@
 #include "views/hatchala/hatchalaView.h"
 
 #include "views/hatchala/StartDecoration.h"
+#include "views/kit/DigitGrid.h"
 #include "views/kit/Overlay.h"
 
 #include <QEvent>
@@ -157,10 +158,23 @@ void hatchalaView::makeShops() {
     bind(u"Picture1"_s, m_shops->card(), [this] { return c.Picture1.text; });
 }
 
+// On a kiosk the customer of the order is known by them.
+QWidget* hatchalaView::makeDigits() {
+    std::array<QPushButton*, 10> digits{};
+    for (int i = 0; i < 10; ++i)
+        digits[static_cast<std::size_t>(i)] =
+            button(c.Command4Sifra[static_cast<std::size_t>(i)], Role::Secondary, &hatchala::Command4Sifra_Click, i);
+    QPushButton* back = button(c.Command4Mehak, Role::Plain, &hatchala::Command4Mehak_Click);
+    QWidget* pad = inMiddle(leftToRight(digitGrid(theme(), digits, back)), 2);
+    follow(pad, c.Label4Sfarot);
+    return pad;
+}
+
 // The offer to go on with an order that was not finished.
 void hatchalaView::makeOffer() {
-    m_offer = new Overlay(
-        theme(), this, {label(c.Pic4Hemshech, "title"), label(c.Label4Hemshech, "large"), label(c.Label4Od, "muted")});
+    m_offer = new Overlay(theme(), this,
+                          {label(c.Pic4Hemshech, "title"), label(c.Label4Hemshech, "large"),
+                           centred(label(c.Label4Sfarot, "display")), label(c.Label4Od, "muted"), makeDigits()});
     QPushButton* goOn = button(c.Command4Hemshech, Role::Main, &hatchala::Command4Hemshech_Click);
     m_offer->addRow({button(c.Command4Bitul, Role::Quiet, &hatchala::Command4Bitul_Click, u"trash"_s), Item::room(),
                      button(c.Command4Achar, Role::Secondary, &hatchala::Command4Achar_Click), goOn});

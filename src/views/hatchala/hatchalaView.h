@@ -33,6 +33,7 @@ private:
     QWidget* makeContact();
     void makeStart();
     void makeShops();
+    QWidget* makeDigits();
     void makeOffer();
     void helpFor(QWidget* widget, hatchala::Hover over);
     void renderMotion();

@@ -216,7 +216,7 @@ void PicturePicker::joinPlaces(const std::vector<Cards::Card>& cards) {
     for (const Cards::Card& card : cards) {
         const HostPath& folder = card.medium.folder;
         const auto isIt = [&](const Place& place) { return place.folder == folder; };
-        if (!card.summary || std::any_of(m_places.begin(), m_places.end(), isIt))
+        if (!card.summary || !isOpenTo(folder) || std::any_of(m_places.begin(), m_places.end(), isIt))
             continue;
         m_places.push_back({toText(folder.filename()), u"card"_s, folder});
         addPlaceButton(m_places.size() - 1);
@@ -260,10 +260,16 @@ void PicturePicker::makeGrid() {
     m_grid->setLayout(inColumn(Space::None, {m_empty}));
 }
 
+bool PicturePicker::isOpenTo(const HostPath& path) const {
+    return !m_state.closedToCustomers() || CustomersMedia(m_files.drives()).hold(path);
+}
+
 HostPath PicturePicker::firstFolder(const DrivePath& initialFolder) const {
+    if (m_places.empty())
+        return {};
     std::error_code absent;
     if (const auto initial = m_files.drives().toHost(initialFolder);
-        everyFile() && initial && std::filesystem::is_directory(*initial, absent))
+        everyFile() && initial && isOpenTo(*initial) && std::filesystem::is_directory(*initial, absent))
         return *initial;
     const auto first =
         std::find_if(m_places.begin(), m_places.end(), [](const Place& place) { return holdsAnything(place.folder); });
@@ -354,6 +360,12 @@ std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initial
         const QString name = drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : drive.name;
         add(name, drive.removable ? u"card"_s : u"drive"_s, drive.folder);
     };
+    if (m_state.closedToCustomers()) {
+        const CustomersMedia media(m_files.drives());
+        for (const Drives::Drive& medium : media.all())
+            addDrive(medium);
+        return result;
+    }
     const auto drives = m_files.drives().drives();
     for (const Drives::Drive& drive : drives) {
         if (drive.removable || drive.offeredFirst)
@@ -382,7 +394,7 @@ void PicturePicker::open(const HostPath& folder) {
     m_unread.clear();
     m_grid->clear();
     m_take->setEnabled(false);
-    m_up->setEnabled(folder.has_relative_path());
+    m_up->setEnabled(folder.has_relative_path() && isOpenTo(folder.parent_path()));
     for (QPushButton* button : m_placeButtons)
         button->setChecked(false);
     for (std::size_t i = 0; i < m_places.size(); ++i) {
@@ -394,12 +406,14 @@ void PicturePicker::open(const HostPath& folder) {
     std::vector<HostPath> folders;
     std::vector<HostPath> files;
     std::error_code error;
-    std::filesystem::directory_iterator at(folder, error);
+    std::filesystem::directory_iterator at;
+    if (isOpenTo(folder))
+        at = std::filesystem::directory_iterator(folder, error);
     for (; !error && at != std::filesystem::directory_iterator(); at.increment(error)) {
         const HostPath& path = at->path();
-        if (nameOf(path).startsWith(u'.'))
-            continue;
         std::error_code kind;
+        if (nameOf(path).startsWith(u'.') || (at->is_symlink(kind) && !isOpenTo(path)))
+            continue;
         if (at->is_directory(kind))
             folders.push_back(path);
         else if ((everyFile() || isPicture(path)) && at->is_regular_file(kind))
@@ -419,8 +433,10 @@ void PicturePicker::open(const HostPath& folder) {
             addPicture(path, false);
     }
     m_empty->setVisible(m_grid->count() == 0);
-    m_empty->setText(error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
-                                             u"This folder can't be opened. Choose another place."_s)
+    m_empty->setText(m_places.empty() ? m_state.wording(u"הכניסו כרטיס זיכרון או זיכרון נייד למכשיר."_s,
+                                                        u"Please put your memory card or stick into the machine."_s)
+                     : error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
+                                               u"This folder can't be opened. Choose another place."_s)
                      : everyFile() ? m_state.wording(u"אין כאן קבצים. בחר מקום אחר."_s,
                                                      u"There are no files here. Choose another place."_s)
                                    : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/Dialogs.h"
+#include "platform/files/CustomersMedia.h"
 #include "platform/files/HostPath.h"
 #include "platform/media/Cards.h"
 #include "views/kit/Overlay.h"
@@ -47,6 +48,8 @@ private:
     };
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
     std::vector<Place> places(const DrivePath& initialFolder) const;
+    // On a kiosk a customer sees cards and sticks alone; one that came since is among them.
+    bool isOpenTo(const HostPath& path) const;
     HostPath firstFolder(const DrivePath& initialFolder) const;
     bool watchesCards() const { return !everyFile() && m_cards.areWatched(); }
     HostPath startOf(const HostPath& place) const;

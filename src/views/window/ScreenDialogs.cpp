@@ -64,6 +64,18 @@ void ScreenDialogs::closeMessages() {
     }
 }
 
+void ScreenDialogs::closeAll() {
+    closeMessages();
+    for (QEventLoop* loop : m_answers)
+        loop->quit();
+}
+
+void ScreenDialogs::waitIn(QEventLoop& loop) {
+    m_answers += &loop;
+    loop.exec();
+    m_answers.removeAll(&loop);
+}
+
 bool ScreenDialogs::ask(const QString& question, const QString& title) {
     shownTexts += question;
     if (nextAnswer) {
@@ -80,7 +92,7 @@ bool ScreenDialogs::ask(const QString& question, const QString& title) {
         loop.quit();
     });
     panel.setOpen(true);
-    loop.exec();
+    waitIn(loop);
     panel.setOpen(false);
     return yes;
 }
@@ -103,7 +115,7 @@ DrivePath ScreenDialogs::pickFile(const QString& prompt, const DrivePath& initia
         loop.quit();
     });
     picker.setOpen(true);
-    loop.exec();
+    waitIn(loop);
     picker.setOpen(false);
     return DrivePath(chosen);
 }

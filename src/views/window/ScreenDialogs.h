@@ -9,6 +9,8 @@
 #include <functional>
 #include <optional>
 
+class QEventLoop;
+
 namespace lumora {
 
 class Cards;
@@ -30,6 +32,9 @@ public:
     bool ask(const QString& question, const QString& title = {}) override;
     DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
                        Offer offer) override;
+
+    bool isWaiting() const override { return !m_answers.isEmpty(); }
+    void closeAll() override;
 
     // Runs before a picture is picked, so that cards put in meanwhile are found.
     std::function<void()> beforePick;
@@ -53,6 +58,7 @@ private:
     };
     void showNext();
     QString closingText() const;
+    void waitIn(QEventLoop& loop);
 
     MainWindow& m_window;
     const SessionState& m_state;
@@ -61,6 +67,7 @@ private:
     const Clock& m_clock;
     QList<Box> m_waiting;
     QPointer<MessagePanel> m_panel;
+    QList<QEventLoop*> m_answers; // loops that wait for one; a loop's box has said no as long as nobody has answered
 };
 
 } // namespace lumora
