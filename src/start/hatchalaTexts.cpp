@@ -96,7 +96,7 @@ void hatchala::showDigits() {
                     {Label4Hemshech, u"זו ההזמנה שלכם? הקישו את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
                      u"Is it yours? Type the last three digits of the telephone number of the order."},
                     {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not fit. Please try again."},
-                    {Command4Mehak, u"מחק ספרה", u"Take a digit back"},
+                    {Command4Mehak, u"", u"", u"מחק ספרה", u"Take a digit back"},
                 });
     Label4Od.visible = m_wrongDigits > 0 && m_digits.isEmpty();
     Label4Sfarot.text = m_digits.leftJustified(telephoneEnd, u'_').split(QString(), Qt::SkipEmptyParts).join(u' ');

@@ -48,14 +48,13 @@ TEST_F(AKioskBetweenCustomers, HasNothingOfTheOneBeforeButTheOrder) {
           "2000lumora\\!!000\\^^^.jpg", "2000lumora\\!!000\\111.jpg"});
     state.staff = true;
     state.EnglishTips = 1;
-    state.handOver.basket = {u"a line"_s};
     state.handOver.notice = u"order 104 stays here"_s;
     machine.shell.clipboard = u"105"_s;
 
     ASSERT_TRUE(CustomerTraces(state, machine.platform).clear());
     EXPECT_THAT(files(), ::testing::UnorderedElementsAreArray(stays));
     EXPECT_TRUE(machine.shell.clipboard.isEmpty());
-    EXPECT_TRUE(state.shemot.n1.isEmpty() && state.shemot.n2.isEmpty() && state.handOver.basket.isEmpty());
+    EXPECT_TRUE(state.shemot.n1.isEmpty() && state.shemot.n2.isEmpty());
     EXPECT_FALSE(state.staff || state.english());
     EXPECT_EQ(state.handOver.notice, u"order 104 stays here") << "said to the one who comes";
 }

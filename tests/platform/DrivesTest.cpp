@@ -1,6 +1,5 @@
 #include "platform/files/Drives.h"
 #include "common/AnsiCodePage.h"
-#include "platform/files/CustomersMedia.h"
 #include "support/DrivePathLiteral.h"
 
 #include <QTemporaryDir>
@@ -34,16 +33,6 @@ protected:
         std::ofstream(media / name / "a.jpg") << "x";
     }
 };
-
-TEST_F(DrivesTest, TellsWhatIsTheCustomersWhateverTheLetters) {
-    insertCard("CARD");
-    fs::create_directories(media / "OURS" / "drive_c");
-    fs::create_directory_symlink(data, media / "CARD" / "others");
-    const CustomersMedia customers(Drives(media / "OURS" / "drive_c", u'F', {media}));
-    EXPECT_TRUE(customers.hold(media / "CARD" / "a.jpg"));
-    for (const HostPath& path : {media / "CARD" / "others", media / "OURS", data, HostPath("/"), HostPath()})
-        EXPECT_FALSE(customers.hold(path)) << path;
-}
 
 TEST_F(DrivesTest, MapsTheLettersBothWays) {
     insertCard("CARD");

@@ -2,10 +2,6 @@
 
 #include "kiosk/IdleEnd.h"
 #include "kiosk/StaffCode.h"
-#include "platform/Platform.h"
-#include "platform/files/Files.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "support/PageRig.h"
 #include "views/window/KioskPanels.h"
 #include "views/window/PicturePicker.h"
@@ -129,7 +125,8 @@ TEST_P(KioskLook, OpensWhatIsTheStaffsBehindTheCornerAndTheCodeAlone) {
         window.findChild<QAbstractButton*>(u"staffEnter"_s)->click();
         walk.settle();
     }
-    EXPECT_TRUE(walk.control(u"Image1(4)"_s).isVisible() && walk.program().state().staff);
+    EXPECT_TRUE(walk.program().state().staff);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return walk.control(u"Image1(4)"_s).isVisible(); }, 5000));
     walk.program().chain().goToStart();
     walk.settle(100);
     EXPECT_FALSE(walk.program().state().staff || walk.control(u"Image3"_s).isVisible());

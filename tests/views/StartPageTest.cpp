@@ -111,11 +111,8 @@ TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
     look(walk, u"01-start-unfinished"_s);
     state.kiosk.on = true;
     chain.setAllTexts();
-    walk.go(u"Command4Sifra(1) Command4Sifra(2)"_s);
-    look(walk, u"01-start-digits"_s);
-    walk.press(u"hatchala"_s, u"Command4Sifra(3)"_s);
-    look(walk, u"01-start-digits-wrong"_s);
-    walk.go(u"Command4Sifra(5) Command4Sifra(6) Command4Sifra(7)"_s);
+    go(walk, u":01-start-digits Command4Sifra(1) Command4Mehak Command4Sifra(2) Command4Sifra(3) Command4Sifra(4) "
+             u":01-start-digits-wrong Command4Sifra(5) Command4Sifra(6) Command4Sifra(7)"_s);
     walk.press(u"hatchala"_s, u"Command4Hemshech"_s);
     look(walk, u"01-start-unfinished-gone"_s);
     walk.press(u"hatchala"_s, u"Command4Achar"_s);

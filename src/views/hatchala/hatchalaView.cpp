@@ -164,8 +164,8 @@ QWidget* hatchalaView::makeDigits() {
     for (int i = 0; i < 10; ++i)
         digits[static_cast<std::size_t>(i)] =
             button(c.Command4Sifra[static_cast<std::size_t>(i)], Role::Secondary, &hatchala::Command4Sifra_Click, i);
-    QPushButton* back = button(c.Command4Mehak, Role::Plain, &hatchala::Command4Mehak_Click);
-    QWidget* pad = inMiddle(leftToRight(digitGrid(theme(), digits, back)), 2);
+    m_takeBack = button(c.Command4Mehak, Role::Secondary, &hatchala::Command4Mehak_Click, u"backspace"_s);
+    QWidget* pad = inMiddle(leftToRight(digitGrid(theme(), digits, m_takeBack)), 2);
     follow(pad, c.Label4Sfarot);
     return pad;
 }
@@ -270,6 +270,7 @@ void hatchalaView::render() {
     renderAdvert();
     renderHelp();
     const QString spoken = c.List1Caption.text.simplified();
+    speak(m_takeBack, c.Command4Mehak.hint);
     speak(m_shops, spoken);
     speak(m_shopList, spoken);
     renderMotion();

@@ -65,6 +65,7 @@ private:
     std::vector<Help> m_helps;
     Overlay* m_shops = nullptr;
     Overlay* m_offer = nullptr;
+    QPushButton* m_takeBack = nullptr;
     QWidget* m_shopList = nullptr;
     std::vector<std::pair<QWidget*, hatchala::Hover>> m_hovers;
 };

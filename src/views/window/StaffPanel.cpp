@@ -41,7 +41,7 @@ StaffPanel::StaffPanel(const Theme& theme, QWidget* parent, const SessionState& 
         digits[static_cast<std::size_t>(i)] =
             named(plainButton(u"staffDigit(%1)"_s.arg(i), "secondary", [this, digit] { type(digit); }), digit);
     }
-    QPushButton* back = plainButton(u"staffTakeBack"_s, "plain", [this] { takeBack(); });
+    QPushButton* back = plainButton(u"staffTakeBack"_s, "secondary", [this] { takeBack(); });
     back->setAccessibleName(state.wording(u"מחק ספרה", u"Take a digit back"));
     setButtonIcon(back, theme, u"backspace"_s, Theme::Colour::Ink);
     add(*column(),

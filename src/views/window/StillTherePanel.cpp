@@ -21,10 +21,11 @@ StillTherePanel::StillTherePanel(const Theme& theme, QWidget* parent, const Sess
     here->setAccessibleName(here->text());
     here->setMinimumHeight(theme.px(64));
     addRow({{inColumn(Space::Normal,
-                      {words("title", title),
+                      {Item::room(), words("title", title),
                        words("body", state.wording(u"אם לא, נחזור לדף הפתיחה, וכל מה שנבחר כאן יימחק.",
                                                    u"If not, we go back to the first page, and all that was chosen "
-                                                   u"here is cleared."))}),
+                                                   u"here is cleared.")),
+                       Item::room()}),
              1},
             m_gauge},
            Space::Wide);
