@@ -52,6 +52,7 @@ FAULTS = {
     'src/common/HostFile.cpp': [
         F('synced && m_error == 0 && ::fsync(m_file.number()) != 0', 'false', 'a print or a state that the disk lost counts as written'),
         F('at->last_write_time(gone) < before', 'true', 'a file that another program is writing goes'),
+        F('failure.kind != Failure::Kind::NoSpace', 'true', 'nobody learns that the disk is full'),
         F('done < count && !target.failed()', 'done < count && !target.failed() && done == 0', 'a piece over 1 MiB is cut')],
     'src/common/PaperSize.cpp': [F('paper.left(2) + between + paper.right(2)', 'paper.right(2) + between + paper.left(2)',
                                    '10/15 is ordered as 15/10')],
@@ -327,8 +328,7 @@ FAULTS = {
     'src/door/DoorDecoder.cpp': [
         F('readPart(file, size - 2, 2, error) == "\\xFF\\xD9"', 'true', 'half a picture of a decoder that died is printed'),
         F('doorNeedOf(*header, u".jpg"_s) == DoorNeed::Nothing', 'true', 'what a decoder that was taken over writes is believed'),
-        F('failure.kind = Failure::Kind::NotFound;', '', 'a card that breaks is told as a fault that nobody knows'),
-        F('full ? Failure::Kind::NoSpace : Failure::Kind::Other', 'Failure::Kind::Other', 'nobody learns that the disk is full')],
+        F('failure.kind = Failure::Kind::NotFound;', '', 'a card that breaks is told as a fault that nobody knows')],
     'src/door/DoorNeed.cpp': [
         F('rules.srgb && coloursOf(header).source != Source::None', 'false', 'a picture of other colours is printed pale'),
         F('rules.upright && header.orientation != 1', 'false', 'a picture lies on its side'),
