@@ -23,7 +23,7 @@ public:
         if (!m_isTerminal)
             return;
         termios silent = m_before;
-        silent.c_lflag &= ~static_cast<tcflag_t>(ECHO);
+        silent.c_lflag &= ~static_cast<tcflag_t>(ECHO | ISIG); // an interrupt would leave the terminal silent
         m_isTerminal = ::tcsetattr(STDIN_FILENO, TCSAFLUSH, &silent) == 0;
     }
     ~NoEcho() {

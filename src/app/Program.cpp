@@ -81,7 +81,8 @@ struct Program::Parts {
         // A browser would lie over the pages, and shows the files of this machine.
         shell.mayOpen = [this] {
             if (state.closedToCustomers())
-                dialogs.message(state.wording(u"במכשיר זה אין גלישה באתרים.", u"This machine opens no web pages."));
+                dialogs.message(state.wording(u"במכשיר זה לא נפתחים אתרים ותיקיות.",
+                                              u"This machine opens no web pages and no folders."));
             return !state.closedToCustomers();
         };
         chain.mayEnd = [this] { return !state.closedToCustomers(); };
@@ -95,9 +96,10 @@ struct Program::Parts {
         });
         dialogs.beforePick = [this] { drives.refreshMedia(); };
         window.mayEnd = [this] {
-            if (state.closedToCustomers())
-                return true; // the start page comes
             const bool choosing = chain.find(PageId::nnn) || chain.find(PageId::kyoskNew);
+            if (state.closedToCustomers()) // the start page comes
+                return !choosing || dialogs.ask(state.wording(u"לוותר על ההזמנה ולחזור לדף הפתיחה?",
+                                                              u"Give the order up and go back to the first page?"));
             return dialogs.ask(choosing ? state.wording(u"לצאת מהתוכנה? הזמנה שעדיין לא נשלחה לא תישמר.",
                                                         u"Leave the program? An order that was not sent yet is lost.")
                                         : state.wording(u"לצאת מהתוכנה?", u"Leave the program?"));

@@ -50,7 +50,7 @@ void OrderKeeping::read() {
         else if (key == doubtedKey)
             m_days.doubted = QDate::fromString(value, Qt::ISODate);
         else if (key == doubtsKey)
-            m_days.doubts = value.toInt();
+            m_days.doubts = std::clamp(value.toInt(), 0, KioskDays::daysUntilBelieved - 1);
         else
             m_arrived[key] = value.toInt();
     }

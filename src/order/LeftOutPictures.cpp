@@ -4,6 +4,7 @@
 #include "imaging/files/PictureFile.h"
 #include "order/KeptPictures.h"
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -36,6 +37,9 @@ void TakeOrderBack(SessionState& state, const Platform& platform) {
     for (const QString& name : files.names(thumbnails, u"*.bmp"_s))
         static_cast<void>(files.removeFile(thumbnails / name));
     const OrderFolder order = OrderFolder::chosen(state);
+    // Where it can't be removed whole, it must not be sent by itself beside the order that takes its place.
+    if (order.isChosen() && ReadOrderState(files, order))
+        static_cast<void>(OrderJournal(files, order).givenUp());
     const Result<void> removed =
         order.isChosen() && files.folderExists(order.path()) ? files.removeTree(order.path()) : Result<void>();
     if (!removed)

@@ -179,6 +179,7 @@ private:
     void throwOrderAway();
     bool anotherRuns() const;
     void endCustomer();
+    void offerToStaff();
     bool asksForDigits() const;
     void typeDigit(int digit);
     void takeDigitBack();
@@ -208,6 +209,7 @@ private:
     Hover m_over = Hover::Nothing;
     QList<UnfinishedOrder> m_unfinished; // the first one is offered
     bool m_recognised = false;           // on a kiosk: the customer of the first one has given the digits
+    bool m_ofStaff = false;              // the offer was read for the staff
     QString m_digits;                    // typed so far
     int m_wrongDigits = 0;               // times in a row
     bool m_asksForGone = false;          // the panel asks whether to go on without the pictures that are gone

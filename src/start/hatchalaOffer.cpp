@@ -71,6 +71,14 @@ void hatchala::readUnfinished() {
     });
 }
 
+// The staff sees what no customer is offered any more, too.
+void hatchala::offerToStaff() {
+    if (m_leaving || std::exchange(m_ofStaff, m_state.staff) || !m_ofStaff)
+        return;
+    m_state.offerPutOff = false;
+    offerUnfinished();
+}
+
 bool hatchala::asksForDigits() const {
     return m_state.closedToCustomers() && !m_recognised;
 }
@@ -119,7 +127,6 @@ void hatchala::putOffOrder() {
         return;
     // Waiting for the pictures leads back to the offer.
     if (!std::exchange(m_asksForGone, false)) {
-        leftAlone();
         m_state.offerPutOff = true;
         m_unfinished.clear();
     }

@@ -13,6 +13,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 void hatchala::setTexts() {
+    offerToStaff();
     setCaptions(m_state,
                 {
                     {Title, u"ברוכים הבאים", u"Welcome"},
@@ -95,8 +96,8 @@ void hatchala::showDigits() {
                     {Command4Achar, u"זו לא ההזמנה שלי", u"It is not my order"},
                     {Label4Hemshech, u"זו ההזמנה שלכם? הקישו את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
                      u"Is it yours? Type the last three digits of the telephone number of the order."},
-                    {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not fit. Please try again."},
-                    {Command4Mehak, u"", u"", u"מחק ספרה", u"Take a digit back"},
+                    {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not match. Please try again."},
+                    {Command4Mehak, u"", u"", u"מחק ספרה", u"Take back a digit"},
                 });
     Label4Od.visible = m_wrongDigits > 0 && m_digits.isEmpty();
     Label4Sfarot.text = m_digits.leftJustified(telephoneEnd, u'_').split(QString(), Qt::SkipEmptyParts).join(u' ');

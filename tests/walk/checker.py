@@ -92,6 +92,7 @@ class Order:
         self.basket, self.whole, self.total, self.paper, self.choice, self.bill = {}, False, None, '', [], []
         self.details, self.closing, self.previews, self.withAddress, self.album = {}, {}, {}, False, False
         self.before = None  # choice and details, while they are changed from the page of pictures
+        self.left = ''      # the latest press on the page of details
 
 
 class Walk:
@@ -122,6 +123,7 @@ class Walk:
                 folder = None
             elif page == 'nnn':
                 order.details.update(shown)
+                order.left = line['act']
                 if 'Text2' in shown:  # the address is asked for only where it is wanted
                     order.details['Text4'] = shown.get('Text4', '')
                 if 'Pic4Bil' in shown:
@@ -130,7 +132,7 @@ class Walk:
                     order.details.pop('Text2', 0), order.details.pop('Text3', 0)
                 order.choice = next((plain(text).split(' · ') for text in line['words'] if ' · ' in text), order.choice)
             elif page == 'kyoskNew':
-                if order.before and line['act'] == 'press nnn.Command3':
+                if order.before and order.left == 'press nnn.Command3':
                     order.previews = {}  # on the paper before
                 elif order.before:
                     order.choice, order.details = order.before

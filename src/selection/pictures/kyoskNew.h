@@ -17,6 +17,7 @@
 #include "session/PageFlow.h"
 #include "session/Ticker.h"
 
+#include <chrono>
 #include <functional>
 #include <initializer_list>
 #include <memory>
@@ -127,7 +128,7 @@ public:
     // --- state ---
 
     const kyoskNewControls& controls() const override { return *this; }
-    bool isWorking() const override { return m_wait.waits(); } // goes on with the order by itself
+    bool isWorking() const override; // goes on with the order by itself
     // Pictures are chosen as they are, and not edited.
     bool plain() const;
     // The cell whose picture is open in the editor, or -1.
@@ -282,6 +283,7 @@ private:
     PageChain& m_chain;
     std::unique_ptr<PictureDoor> m_door;
     DoorWait m_wait;
+    std::chrono::milliseconds m_waitMoved{}; // of the running clock
     void (kyoskNew::*m_onceMade)() = &kyoskNew::openFinish;
     PictureChoice m_choice;
     CopiesEntry m_copiesEntry;

@@ -1,6 +1,7 @@
 // The page of pictures: those that are no ordinary JPEG files, and are made ready in the background.
 #include "order/DoorFolders.h"
 #include "platform/Dialogs.h"
+#include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/door/PictureDoor.h"
 #include "selection/pictures/kyoskNew.h"
@@ -136,7 +137,13 @@ void kyoskNew::onceMade(void (kyoskNew::*goOn)()) {
     showWaiting();
 }
 
+// A card that hangs does not hold the page for good.
+bool kyoskNew::isWorking() const {
+    return m_wait.waits() && m_platform.clock.running() - m_waitMoved < std::chrono::minutes(5);
+}
+
 void kyoskNew::showWaiting() {
+    m_waitMoved = m_platform.clock.running();
     const DoorWait::Then then =
         m_wait.count(m_choice.basket().paths(), [this](const QString& path) { return isCopied(path); });
     doorPanel.visible = m_wait.waits();

@@ -59,7 +59,10 @@ QString albumText(const SessionState& state) {
     return joined({told(album.SoogLBM), told(album.GodelLBM), told(album.SoogKricha), told(album.SoogNiar)});
 }
 
+// The log of an order that is sent again does not tell it.
 QString deliveryText(const SessionState& state) {
+    if (state.transfer.SugMishloah != Sending::NewOrder)
+        return {};
     if (state.MishloachHabaita || state.KodMishloach == u"HOM"_s)
         return joined({state.wording(u"משלוח עד הבית", u"to your home"), told(state.shemot.n3)});
     const auto branch = std::ranges::find_if(state.profile.Branches,
@@ -93,7 +96,7 @@ QList<OrderFact> OrderFacts(const SessionState& state) {
         {state.wording(u"תמונות", u"Prints"), prints > 0 ? QString::number(prints) : QString()},
         {state.wording(u"נייר", u"Paper"), state.Optint == OrderKind::Album ? QString() : paperText(state)},
         {state.wording(u"אלבום", u"Album"), state.Optint == OrderKind::Album ? albumText(state) : QString()},
-        {state.wording(u"קבלה", u"Delivery"), deliveryText(state)},
+        {state.wording(u"אופן הקבלה", u"Delivery"), deliveryText(state)},
         {state.wording(u"הערה", u"Note"), noteText(state)}};
     facts.removeIf([](const OrderFact& fact) { return fact.text.isEmpty(); });
     return facts;

@@ -215,8 +215,13 @@ void SendingPage::readPrints() {
         m_previews.read(order, PrintFileShape::of(m_state.profile));
 }
 
+// The details of an order that is sent again are read from its log by FTP alone; else the session's are another's.
+bool SendingPage::knowsCustomer() const {
+    return m_state.transfer.SugMishloah == Sending::NewOrder || id() == PageId::FtpFrm;
+}
+
 void SendingPage::showFacts() {
-    QList<OrderFact> facts = hasOrder(m_phase) ? OrderFacts(m_state) : QList<OrderFact>();
+    QList<OrderFact> facts = hasOrder(m_phase) && knowsCustomer() ? OrderFacts(m_state) : QList<OrderFact>();
     if (isThanked(m_phase))
         facts.prepend({wording(u"תאריך", u"Date"), m_platform.clock.now().date().toString(u"dd/MM/yyyy"_s)});
     for (qsizetype i = 0; i < mostFacts; ++i) {
@@ -229,7 +234,7 @@ void SendingPage::showFacts() {
 }
 
 void SendingPage::showThanks() {
-    const QString name = CalledName(m_state);
+    const QString name = knowsCustomer() ? CalledName(m_state) : QString();
     const bool thanked = isThanked(m_phase);
     const bool printsNext = m_phase == SendingPhase::Success && !(m_state.Careful && report().isEndUnknown());
     m_shown.thanks.visible = thanked;

@@ -132,6 +132,7 @@ private:
     QString adviceOf(const PhaseLook& row) const;
     BothLanguages inBoth(const std::function<QString(const SessionState&)>& words) const;
     bool goesOnByItself(SendingPhase phase) const;
+    bool knowsCustomer() const;
     void showFacts();
     void showThanks();
     void watchCards();

@@ -172,7 +172,8 @@ void FtpFrm::showIncomplete(int missing) {
     Label12.text = QString::number(m_sender.NumToSend);
     Label31.text = QString::number(lists().List9.count());
     Label4Missing.text = QString::number(missing);
-    Label4Mitoch.text = wording(u"קבצים מתוך ", missing == 1 ? u"file out of " : u"files out of ");
+    Label4Mitoch.text =
+        missing == 1 ? wording(u"קובץ מתוך ", u"file out of ") : wording(u"קבצים מתוך ", u"files out of ");
     QStringList sentence;
     for (const Caption* part : {&Label4Nichshal, &Label4Missing, &Label4Mitoch, &Label12, &Label4Yooadoo})
         sentence += part->text.trimmed();

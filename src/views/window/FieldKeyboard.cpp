@@ -180,6 +180,8 @@ void FieldKeyboard::setUp() {
 
 // The first letter of a word is a large one, but for an address.
 void FieldKeyboard::capitalise() {
+    if (!m_field) // its page may go while a key is held
+        return;
     const QString before = textBefore(*m_field);
     m_keys->setCapitals(!(m_field->inputMethodHints() & Qt::ImhEmailCharactersOnly) &&
                         (before.isEmpty() || before.back().isSpace()));

@@ -42,7 +42,7 @@ StaffPanel::StaffPanel(const Theme& theme, QWidget* parent, const SessionState& 
             named(plainButton(u"staffDigit(%1)"_s.arg(i), "secondary", [this, digit] { type(digit); }), digit);
     }
     QPushButton* back = plainButton(u"staffTakeBack"_s, "secondary", [this] { takeBack(); });
-    back->setAccessibleName(state.wording(u"מחק ספרה", u"Take a digit back"));
+    back->setAccessibleName(state.wording(u"מחק ספרה", u"Take back a digit"));
     setButtonIcon(back, theme, u"backspace"_s, Theme::Colour::Ink);
     add(*column(),
         {centred(words("large", title)), m_dots, m_words, inMiddle(leftToRight(digitGrid(theme, digits, back)), 2)});

@@ -22,9 +22,9 @@ StillTherePanel::StillTherePanel(const Theme& theme, QWidget* parent, const Sess
     here->setMinimumHeight(theme.px(64));
     addRow({{inColumn(Space::Normal,
                       {Item::room(), words("title", title),
-                       words("body", state.wording(u"אם לא, נחזור לדף הפתיחה, וכל מה שנבחר כאן יימחק.",
-                                                   u"If not, we go back to the first page, and all that was chosen "
-                                                   u"here is cleared.")),
+                       words("body", state.wording(u"אם לא, נחזור לדף הפתיחה, ודבר ממה שנבחר כאן לא יוצג עוד.",
+                                                   u"If not, we go back to the first page, and nothing that was "
+                                                   u"chosen here is shown any more.")),
                        Item::room()}),
              1},
             m_gauge},
