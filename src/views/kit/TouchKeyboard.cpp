@@ -137,7 +137,7 @@ void TouchKeyboard::setOffers(const QStringList& texts) {
         delete item;
     }
     for (int at = 0; at < texts.size(); ++at) {
-        const QString text = texts[at];
+        const QString& text = texts[at];
         QPushButton* made = wordKey(u"key(%1)"_s.arg(text), [this, text] { Q_EMIT offered(text); });
         made->setText(text);
         m_offerGrid->addWidget(made, at / offersInRow, at % offersInRow);
