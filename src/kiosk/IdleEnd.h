@@ -5,8 +5,6 @@
 
 #include <QObject>
 
-#include <optional>
-
 namespace lumora {
 
 class PageChain;

@@ -2,8 +2,6 @@
 
 #include <QDate>
 
-#include <optional>
-
 namespace lumora {
 
 // The days that a kiosk has lived through. A clock that is set wrong makes no time pass: a step of the date counts when

@@ -53,7 +53,7 @@ QString NewStaffCodeLine(const QString& code) {
 }
 
 bool IsStaffCode(const QString& code) {
-    return code.size() >= 4 && code.size() <= 12 &&
+    return code.size() >= shortestStaffCode && code.size() <= longestStaffCode &&
            std::all_of(code.begin(), code.end(), [](QChar digit) { return digit >= u'0' && digit <= u'9'; });
 }
 

@@ -17,7 +17,9 @@ struct SessionState;
 QString StaffCodeLine(const QString& code, const QByteArray& salt, int iterations);
 // The same with a salt of the machine's own and the iterations that are usual now.
 QString NewStaffCodeLine(const QString& code);
-// 4 to 12 digits: the staff types it on the screen.
+// The staff types it on the screen.
+inline constexpr int shortestStaffCode = 4; // digits
+inline constexpr int longestStaffCode = 12;
 bool IsStaffCode(const QString& code);
 
 // Lets the staff in. From the fifth wrong try in a row each costs a minute. How many there were is kept in the data

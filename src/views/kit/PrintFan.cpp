@@ -35,7 +35,7 @@ QSize PrintFan::minimumSizeHint() const {
     return {m_theme.px(240), m_theme.px(120)};
 }
 
-// The prints before the first are painted from the outer ones inwards.
+// From the last to the first, which lies on top.
 void PrintFan::paintEvent(QPaintEvent*) {
     if (m_prints.empty())
         return;

@@ -7,15 +7,11 @@
 #include <QKeyEvent>
 #include <QTimer>
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-constexpr int longestCode = 12;
-
-} // namespace
 
 StaffPanel::StaffPanel(const Theme& theme, QWidget* parent, const SessionState& state, StaffCode& code)
     : Overlay(theme, parent)
@@ -57,7 +53,7 @@ StaffPanel::StaffPanel(const Theme& theme, QWidget* parent, const SessionState& 
 }
 
 void StaffPanel::type(const QString& digit) {
-    if (m_typed.size() < longestCode)
+    if (m_typed.size() < longestStaffCode)
         m_typed += digit;
     m_told.clear();
     render();
