@@ -62,6 +62,7 @@ public:
     // what the customer has given; a loop that asks hasEnded() stops for it.
     void goToStart();
     bool hasEnded() const { return m_ended || m_goesToStart; }
+    bool goesToStart() const { return m_goesToStart; } // the start page comes next
 
     bool isAnyWorking() const;
     // In the language of the session, and with what the session allows.

@@ -625,7 +625,7 @@ FAULTS = {
         F('lowest - m_keys->y()', '0', 'the field lies behind the keys'),
         F('line->echoMode() != QLineEdit::Normal', 'false', 'keys rise for what is hidden'),
         F('before.back().isSpace()', 'false', 'a second name begins small'),
-        F('field && field == touched', 'field', 'keys rise where nobody has touched')],
+        F('field && field == touched', 'field != nullptr', 'keys rise where nobody has touched')],
     'src/views/window/PressFilter.cpp': [
         F('away.manhattanLength() > samePlace', 'true', 'the second half of a doubled touch types a letter'),
         F('rule.seen();', '', 'who types fast loses letters')],

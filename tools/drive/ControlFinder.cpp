@@ -210,8 +210,7 @@ Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QStri
     return pressDown(hit, middleOf(hit));
 }
 
-Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control, QPointF percent,
-                                                Qt::MouseButton button) const {
+Result<ControlFinder::Hit> ControlFinder::hitAt(const QString& page, const QString& control, QPointF percent) const {
     const Result<QWidget*> found = inSight(page, control);
     if (!found)
         return found.failure();
@@ -222,8 +221,15 @@ Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QStri
         return fail(u"%1.%2 at %3 %4 is %5"_s.arg(page, control).arg(percent.x()).arg(percent.y()).arg(why));
     // A child widget at that point receives the press, as from a person.
     QWidget* inside = widget.childAt(at);
-    QWidget& hit = inside ? *inside : widget;
-    return pressDown(hit, hit.mapFrom(&widget, at), button);
+    return inside ? Hit{inside, inside->mapFrom(&widget, at)} : Hit{&widget, at};
+}
+
+Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QString& control, QPointF percent,
+                                                Qt::MouseButton button) const {
+    const Result<Hit> hit = hitAt(page, control, percent);
+    if (!hit)
+        return hit.failure();
+    return pressDown(*hit->widget, hit->at, button);
 }
 
 void ControlFinder::letGo(const Held& held) const {
@@ -307,6 +313,14 @@ Result<void> ControlFinder::touch(const QString& page, const QString& control) c
         return widget.failure();
     QWidget& hit = target(**widget);
     tap(hit, placeToPress(hit));
+    return {};
+}
+
+Result<void> ControlFinder::touchAt(const QString& page, const QString& control, QPointF percent) const {
+    const Result<Hit> hit = hitAt(page, control, percent);
+    if (!hit)
+        return hit.failure();
+    tap(*hit->widget, hit->at);
     return {};
 }
 

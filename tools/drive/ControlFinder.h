@@ -44,6 +44,7 @@ public:
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
     // With a finger. The page "keyboard" is the keys on the screen.
     Result<void> touch(const QString& page, const QString& control) const;
+    Result<void> touchAt(const QString& page, const QString& control, QPointF percent) const;
     // Touches the box, and then the keys on the screen, also those that bring other letters.
     Result<void> touchType(const QString& page, const QString& control, const QString& text) const;
     // Chooses the row with this text in a list or a combo box.
@@ -66,6 +67,12 @@ private:
     Result<PageView*> view(const QString& page) const;
     Result<QWidget*> inSight(const QString& page, const QString& control) const;
     Result<QWidget*> pressable(const QString& page, const QString& control) const;
+    // What a press at this point of a control would hit, and where.
+    struct Hit {
+        QWidget* widget;
+        QPoint at;
+    };
+    Result<Hit> hitAt(const QString& page, const QString& control, QPointF percent) const;
 
     MainWindow& m_window;
 };

@@ -40,8 +40,8 @@ struct Grammar {
 
 constexpr double patienceOfPage = 30; // seconds, if the line names none
 
-const std::array<Grammar, 22>& grammars() {
-    static const std::array<Grammar, 22> all{{
+const std::array<Grammar, 23>& grammars() {
+    static const std::array<Grammar, 23> all{{
         {ScenarioVerb::Page,
          "page",
          {Takes::Page, Takes::OptionalSeconds},
@@ -51,6 +51,10 @@ const std::array<Grammar, 22>& grammars() {
          "touch",
          {Takes::Control},
          "PAGE.CONTROL, or a key on the screen by its name, \"keyboard.keyDone\": with a finger"},
+        {ScenarioVerb::TouchAt,
+         "touch-at",
+         {Takes::Control, Takes::From},
+         "PAGE.CONTROL X Y: percent of its width and height, with a finger"},
         {ScenarioVerb::TouchType,
          "touch-type",
          {Takes::Control, Takes::SomeText},

@@ -14,6 +14,7 @@ enum class ScenarioVerb {
     Page,
     Press,
     Touch,
+    TouchAt,
     TouchType,
     PressAt,
     Hold,
@@ -45,7 +46,7 @@ struct ScenarioCommand {
     double seconds = 0;    // page, until, until-visible, pause, hold
     int number = 0;        // expect-count, expect-item
     bool yes = false;      // tick, answer, expect-visible, until-visible
-    QPointF from, to;      // press-at (only from), drag: per cent of the control's width and height
+    QPointF from, to;      // press-at, touch-at (only from), drag: per cent of the control's width and height
     bool rightKey = false; // press-at: right mouse button
 };
 

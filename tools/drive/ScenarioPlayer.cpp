@@ -32,7 +32,8 @@ constexpr double patienceOfWork = 900;  // seconds until work that does not end 
 bool touches(ScenarioVerb verb) {
     return verb == ScenarioVerb::Press || verb == ScenarioVerb::PressAt || verb == ScenarioVerb::Hold ||
            verb == ScenarioVerb::Drag || verb == ScenarioVerb::Type || verb == ScenarioVerb::Choose ||
-           verb == ScenarioVerb::Tick || verb == ScenarioVerb::Touch || verb == ScenarioVerb::TouchType;
+           verb == ScenarioVerb::Tick || verb == ScenarioVerb::Touch || verb == ScenarioVerb::TouchAt ||
+           verb == ScenarioVerb::TouchType;
 }
 
 QString deed(ScenarioVerb verb) {
@@ -42,6 +43,7 @@ QString deed(ScenarioVerb verb) {
     case ScenarioVerb::Drag:
         return u"drag"_s;
     case ScenarioVerb::Touch:
+    case ScenarioVerb::TouchAt:
         return u"touch"_s;
     case ScenarioVerb::TouchType:
     case ScenarioVerb::Type:
@@ -101,6 +103,8 @@ void ScenarioPlayer::step() {
             finish();
         return;
     }
+    if (m_program.chain().goesToStart())
+        return;
     if (m_program.chain().hasEnded())
         return fail(place(), u"a running program"_s, u"it has ended"_s);
 
@@ -165,6 +169,8 @@ Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
         return m_controls.pressAt(page, control, command.from, command.rightKey ? Qt::RightButton : Qt::LeftButton);
     case ScenarioVerb::Touch:
         return m_controls.touch(page, control);
+    case ScenarioVerb::TouchAt:
+        return m_controls.touchAt(page, control, command.from);
     case ScenarioVerb::TouchType:
         return m_controls.touchType(page, control, command.text);
     case ScenarioVerb::Drag:
@@ -242,6 +248,7 @@ ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
     case ScenarioVerb::Choose:
     case ScenarioVerb::Tick:
     case ScenarioVerb::Touch:
+    case ScenarioVerb::TouchAt:
     case ScenarioVerb::TouchType:
         break; // done by touch()
     }

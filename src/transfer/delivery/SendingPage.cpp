@@ -123,7 +123,15 @@ QString SendingPage::adviceOf(const PhaseLook& row) const {
     if (lacksChosen && row.phase == SendingPhase::Reporting)
         return wording(partReportingAdvice);
     const bool countIsTold = m_lacking && row.phase == SendingPhase::AllThere;
-    return lacksChosen && row.tellsWhole && !countIsTold ? wording(partSentAdvice) : advice(row);
+    if (!row.tellsWhole || countIsTold)
+        return advice(row);
+    if (!mayBeClosed())
+        return wording(lacksChosen ? kioskPartSentAdvice : kioskSentAdvice);
+    return lacksChosen ? wording(partSentAdvice) : advice(row);
+}
+
+bool SendingPage::mayBeClosed() const {
+    return !m_state.closedToCustomers();
 }
 
 bool SendingPage::goesOnByItself(SendingPhase phase) const {

@@ -118,6 +118,8 @@ protected:
     void endWayBack();
     void leaveForNewOrder();
     void leaveProgram();
+    // Not by a customer of a kiosk.
+    bool mayBeClosed() const;
 
     QString wording(const char16_t* hebrew, const char16_t* english) const;
     QString wording(const SendingWords& words) const { return wording(words.hebrew, words.english); }

@@ -33,6 +33,11 @@ inline constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפש�
                                          u"The whole order has arrived. You can close, or begin a new order."};
 inline constexpr SendingWords partSentAdvice{u"מה שבהזמנה הגיע. אפשר לסגור או להתחיל הזמנה חדשה.",
                                              u"What is in the order has arrived. You can close, or begin a new order."};
+// A kiosk is closed by nobody.
+inline constexpr SendingWords kioskSentAdvice{u"כל ההזמנה הגיעה. אפשר להתחיל הזמנה חדשה.",
+                                              u"The whole order has arrived. You can begin a new order."};
+inline constexpr SendingWords kioskPartSentAdvice{u"מה שבהזמנה הגיע. אפשר להתחיל הזמנה חדשה.",
+                                                  u"What is in the order has arrived. You can begin a new order."};
 inline constexpr SendingWords untoldAdvice{
     u"ההזמנה הגיעה, ולא ידוע אם המעבדה קיבלה על כך הודעה. יש להודיע על כך לחנות.",
     u"Your order has arrived, and it is not known whether the lab was told of it. Please tell the shop."};

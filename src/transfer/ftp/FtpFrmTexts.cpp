@@ -121,7 +121,7 @@ void FtpFrm::showPhase(const PhaseLook& row) {
     Pic4Blink.visible = row.sign == SendingSign::Seconds && row.phase != SendingPhase::Waiting;
     Command23.visible = row.buttons.testAnyFlags(SendingButtons(Hold) | GoOn);
     Command10.visible = row.buttons.testFlag(SendAgain);
-    Command11.visible = Command11.enabled = row.buttons.testFlag(Close);
+    Command11.visible = Command11.enabled = row.buttons.testFlag(Close) && mayBeClosed();
     Command23.text = row.buttons.testFlag(GoOn) ? wording(u"המשך", u"Go on") : wording(u"עצור משלוח", u"Stop sending");
     PicInProgKatan.visible = underWay && inPieces();
     Pic4Failure.visible = ended && (m_incomplete || !reason().isEmpty());
@@ -142,6 +142,7 @@ void FtpFrm::showMinutes() {
 
 void FtpFrm::setTexts() {
     Command24.visible = m_state.mayOpenOperatorArea();
+    Image3.visible = mayBeClosed();
     if (m_state.kiosk.on)
         Image4.visible = m_state.staff && phase() != SendingPhase::Success;
     setCaptions(

@@ -96,7 +96,7 @@ void UploadForm::showPhase(const PhaseLook& row) {
     Command15.visible = Command15.enabled = row.buttons.testFlag(Stop);
     Command10.visible = row.buttons.testFlag(GoOn);
     Command10.enabled = !isAnswerAwaited();
-    endClose.visible = row.buttons.testFlag(Close);
+    endClose.visible = row.buttons.testFlag(Close) && mayBeClosed();
     Label11.visible = row.phase == SendingPhase::AllThere && !m_lacking;
     if (row.phase == SendingPhase::Waiting)
         Picture1.visible = Pic4Timer.visible = Picture5.visible = false;
@@ -151,6 +151,7 @@ void UploadForm::showAnswers() {
 
 void UploadForm::setTexts() {
     Command24.visible = m_state.mayOpenOperatorArea();
+    Image3.visible = mayBeClosed();
     setCaptions(m_state, {{Command2, u"רענן רשימה", u"Refresh list"},
                           {Command3, u"עצור את המשלוח", u"Stop the sending"},
                           {Command10, u"המשך את המשלוח", u"Continue the sending"},
