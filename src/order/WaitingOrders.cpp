@@ -27,32 +27,38 @@ bool waitsForAnswer(const SessionState& state, const Files& files, const Unfinis
 
 } // namespace
 
-QList<UnfinishedOrder> OrdersThatWait(const SessionState& state, const Platform& platform) {
-    if (!state.Waiting || platform.instances.another())
-        return {};
-    QList<UnfinishedOrder> orders = UnfinishedOrders(state, platform.files);
-    orders.removeIf([&](const UnfinishedOrder& order) {
-        return order.state.phase == OrderState::Phase::Preparing || order.state.givenUp ||
-               waitsForAnswer(state, platform.files, order) ||
-               !ReadOrderState(platform.files, order.folder); // a person decides about a state that is only guessed
-    });
-    std::reverse(orders.begin(), orders.end());
-    return orders;
+QList<WaitingOrder> OrdersThatWait(const SessionState& state, const Platform& platform) {
+    QList<WaitingOrder> waiting;
+    if ((!state.Waiting && !state.kiosk.on) || platform.instances.another())
+        return waiting;
+    for (const UnfinishedOrder& order : UnfinishedOrders(state, platform.files)) {
+        // A person decides about a state that is only guessed.
+        if (order.state.phase == OrderState::Phase::Preparing || order.state.givenUp ||
+            !ReadOrderState(platform.files, order.folder))
+            continue;
+        const bool byItself = state.Waiting && !waitsForAnswer(state, platform.files, order);
+        if (byItself || (state.kiosk.on && order.state.lapsed))
+            waiting.prepend({order, byItself});
+    }
+    return waiting;
 }
 
 void WaitingOrders::refresh() {
     m_orders = OrdersThatWait(m_state, m_platform);
-    for (const UnfinishedOrder& order : m_orders) {
-        if (!m_due.contains(order.folder.name()))
-            m_due[order.folder.name()] = afterPause(order.state.tries);
+    QHash<QString, Moment> due;
+    for (const WaitingOrder& waiting : m_orders) {
+        const OrderFolder& folder = waiting.order.folder;
+        due[folder.name()] =
+            m_due.contains(folder.name()) ? m_due[folder.name()] : afterPause(waiting.order.state.tries);
     }
+    m_due = due;
 }
 
 std::optional<UnfinishedOrder> WaitingOrders::due() const {
     const Moment now = m_platform.clock.running();
-    for (const UnfinishedOrder& order : m_orders) {
-        if (m_due.value(order.folder.name()) <= now)
-            return order;
+    for (const WaitingOrder& waiting : m_orders) {
+        if (waiting.byItself && m_due.value(waiting.order.folder.name()) <= now)
+            return waiting.order;
     }
     return std::nullopt;
 }

@@ -53,8 +53,8 @@ QStringList OrderResolution::coarse(const Basket& basket) {
     for (const QString& text : basket.lines().items()) {
         const BasketLine line = BasketLine::split(text, basket.form());
         const QString& path = line.path.text();
-        static_cast<void>(sizeOf(path));
-        const std::optional<PrintResolution> resolution = of(path, line.editState);
+        const std::optional<PictureSize> size = sizeOf(path);
+        const std::optional<PrintResolution> resolution = size ? of(*size, line.editState) : std::nullopt;
         if (resolution && resolution->grade() == PrintResolution::Grade::Coarse)
             paths += path;
     }

@@ -63,10 +63,10 @@ void hatchala::readUnfinished() {
         m_unfinished = OfferedOnKiosk(m_unfinished, m_platform.files);
     if (!m_state.Waiting)
         return;
-    const QList<UnfinishedOrder> waiting = OrdersThatWait(m_state, m_platform);
+    const QList<WaitingOrder> waiting = OrdersThatWait(m_state, m_platform);
     m_unfinished.removeIf([&](const UnfinishedOrder& order) {
-        return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const UnfinishedOrder& other) {
-                   return other.folder.path() == order.folder.path();
+        return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const WaitingOrder& other) {
+                   return other.byItself && other.order.folder.path() == order.folder.path();
                });
     });
 }

@@ -161,17 +161,24 @@ TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
     give(u"2026_11_21_KUP_1234^102"_s, inPhase(Phase::Sending), {print});
     const OrderFolder lacking = give(u"2026_11_21_KUP_1234^101"_s, inPhase(Phase::Prepared), {print});
     giveLog(lacking, {}, {u"C:\\pics\\gone.jpg"_s});
-    const auto waiting = [this](bool on, bool careful) {
+    OrderState nobodyCame = inPhase(Phase::Prepared);
+    nobodyCame.lapsed = true;
+    const OrderFolder lapsed = give(u"2026_11_21_KUP_1234^100"_s, nobodyCame, {print});
+    giveLog(lapsed, {}, {u"C:\\pics\\gone.jpg"_s});
+    const auto waiting = [this](bool on, bool careful, bool kiosk) {
         session.Waiting = on;
         session.Careful = careful;
+        session.kiosk.on = kiosk;
         QString numbers;
-        for (const UnfinishedOrder& order : OrdersThatWait(session, test.platform))
-            numbers += order.folder.name().last(3) + u' ';
+        for (const WaitingOrder& one : OrdersThatWait(session, test.platform))
+            numbers += one.order.folder.name().last(3) + QLatin1StringView(one.byItself ? " " : "? ");
         return numbers.toStdString();
     };
-    EXPECT_EQ(waiting(false, false), "");
-    EXPECT_EQ(waiting(true, false), "101 102 ");
-    EXPECT_EQ(waiting(true, true), "102 ") << "the customer is to answer about the pictures left out";
+    EXPECT_EQ(waiting(false, false, false), "");
+    EXPECT_EQ(waiting(true, false, false), "100 101 102 ");
+    EXPECT_EQ(waiting(true, true, false), "102 ") << "the customer is to answer about the pictures left out";
+    EXPECT_EQ(waiting(false, true, true), "100? ") << "on a kiosk nobody but the staff would know";
+    EXPECT_EQ(waiting(true, true, true), "100? 102 ");
 
     using std::chrono::minutes;
     std::optional<WaitingOrders> rule(std::in_place, session, test.platform);

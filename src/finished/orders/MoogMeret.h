@@ -3,7 +3,7 @@
 #include "finished/mail/PackageWalk.h"
 #include "finished/orders/FilesToSend.h"
 #include "imaging/Bitmap.h"
-#include "order/UnfinishedOrders.h"
+#include "order/WaitingOrders.h"
 #include "session/Caption.h"
 #include "session/Page.h"
 #include "session/TextList.h"
@@ -217,7 +217,7 @@ private:
     bool asksToThrowAway(const QString& number);
     bool asksToGiveUp(const QString& number);
     void tellNotGivenUp(const Failure& failure);
-    QString waitingRow(const UnfinishedOrder& order) const;
+    QString waitingRow(const WaitingOrder& waiting) const;
     bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
 
     void sendByMail();
@@ -246,7 +246,7 @@ private:
     FilesToSend m_files;
     QStringList m_notFinished; // names of the listed orders whose preparation did not come to its end
     QStringList m_givenUp;     // and of those that the staff has given up
-    QList<UnfinishedOrder> m_waiting;
+    QList<WaitingOrder> m_waiting;
     PackageWalk m_walk;
     bool m_walksWholeOrder = false; // all prints of the order are among the packages
     Ticker Timer3;

@@ -72,12 +72,15 @@ MoogMeret::OrderRow MoogMeret::orderRow(const QString& folderName) const {
     return row;
 }
 
-QString MoogMeret::waitingRow(const UnfinishedOrder& order) const {
+QString MoogMeret::waitingRow(const WaitingOrder& waiting) const {
+    const UnfinishedOrder& order = waiting.order;
     const OrderDetails details = detailsOf(order.folder.path());
     const QString tries = m_state.wording(u"ניסיונות: %1, גודל: %2 מ\"ב"_s, u"tries: %1, size: %2 MB"_s)
                               .arg(QString::number(order.state.tries), megabytesOf(order.folder));
     QStringList lines{orderRow(order.folder.name()).text, QString(details.n1 + u' ' + details.n2).trimmed(), tries,
                       m_state.wording(order.state.why.hebrew, order.state.why.english)};
+    if (!waiting.byItself)
+        lines += m_state.wording(u"אינה נשלחת מעצמה"_s, u"is not sent by itself"_s);
     lines.removeAll(QString());
     return lines.join(u'\n');
 }

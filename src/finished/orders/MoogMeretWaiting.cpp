@@ -2,7 +2,6 @@
 #include "finished/orders/MoogMeret.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
-#include "order/WaitingOrders.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
@@ -13,10 +12,10 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 void MoogMeret::listWaiting() {
-    m_waiting = m_state.mayOpenOperatorArea() ? OrdersThatWait(m_state, m_platform) : QList<UnfinishedOrder>();
+    m_waiting = m_state.mayOpenOperatorArea() ? OrdersThatWait(m_state, m_platform) : QList<WaitingOrder>();
     List4Mamtinot.clear();
-    for (const UnfinishedOrder& order : std::as_const(m_waiting))
-        List4Mamtinot.append(waitingRow(order));
+    for (const WaitingOrder& waiting : std::as_const(m_waiting))
+        List4Mamtinot.append(waitingRow(waiting));
     waitingPanel.visible = !List4Mamtinot.isEmpty();
     chooseWaiting(-1);
 }
@@ -29,7 +28,7 @@ void MoogMeret::chooseWaiting(int index) {
 
 const UnfinishedOrder* MoogMeret::chosenWaiting() const {
     const int index = List4Mamtinot.currentIndex();
-    return mayAct() && index >= 0 ? &m_waiting[index] : nullptr;
+    return mayAct() && index >= 0 ? &m_waiting[index].order : nullptr;
 }
 
 void MoogMeret::tryNow() {

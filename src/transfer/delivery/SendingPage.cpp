@@ -137,9 +137,9 @@ bool SendingPage::mayBeClosed() const {
 bool SendingPage::goesOnByItself(SendingPhase phase) const {
     if (phase != SendingPhase::NotAll && phase != SendingPhase::Unclear && phase != SendingPhase::Stopped)
         return false;
-    const QList<UnfinishedOrder> waiting = OrdersThatWait(m_state, m_platform);
-    return std::any_of(waiting.begin(), waiting.end(), [this](const UnfinishedOrder& order) {
-        return order.folder.path() == m_state.transfer.OrderFolder;
+    const QList<WaitingOrder> waiting = OrdersThatWait(m_state, m_platform);
+    return std::any_of(waiting.begin(), waiting.end(), [this](const WaitingOrder& one) {
+        return one.byItself && one.order.folder.path() == m_state.transfer.OrderFolder;
     });
 }
 
