@@ -4,13 +4,16 @@
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/TouchKeyboard.h"
 #include "views/window/DoubledPress.h"
+#include "views/window/FieldKeyboard.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 
 #include <QAbstractButton>
+#include <QAbstractItemView>
 #include <QApplication>
 #include <QCheckBox>
 #include <QComboBox>
+#include <QEventLoop>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QListWidget>
@@ -19,6 +22,7 @@
 #include <QPointingDevice>
 #include <QPushButton>
 #include <QScrollArea>
+#include <QTimer>
 #include <QWindow>
 #include <QtGui/qtestsupport_gui.h>
 
@@ -55,33 +59,10 @@ void mouse(QWidget& widget, QPoint at, QEvent::Type type, Qt::MouseButtons held,
     QApplication::sendEvent(&widget, &event);
 }
 
-ControlFinder::Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) {
-    const QPointer<QWidget> alive(&widget);
-    // A widget that tracks the mouse sees it move before the press.
-    if (widget.hasMouseTracking())
-        mouse(widget, at, QEvent::MouseMove, Qt::NoButton, Qt::NoButton);
-    if (alive)
-        mouse(*alive, at, QEvent::MouseButtonPress, button, button);
-    return {alive, at, button};
-}
-
-void letMouseGo(const ControlFinder::Held& held) {
-    if (held.widget && held.widget->isVisible())
-        mouse(*held.widget, held.at, QEvent::MouseButtonRelease, Qt::NoButton, held.button);
-}
-
-void click(QWidget& widget, QPoint at) {
-    letMouseGo(pressDown(widget, at));
-}
-
-// A finger at the screen, whose press comes to the controls as that of a mouse.
-void tap(QWidget& widget, QPoint at) {
-    static QPointingDevice* const finger = QTest::createTouchDevice();
-    QWidget& window = *widget.window();
-    const QPointF place = widget.mapTo(&window, at);
-    for (const auto state : {QEventPoint::Pressed, QEventPoint::Released})
-        qt_handleTouchEvent(window.windowHandle(), finger, {{0, state, place, window.mapToGlobal(place)}});
-    QCoreApplication::sendPostedEvents(nullptr, QEvent::MetaCall); // the keys rise behind the touch
+// A finger at the screen, which comes to controls that know none as a mouse.
+void finger(const QWidget& window, QPoint place, QEventPoint::State state) {
+    static QPointingDevice* const screen = QTest::createTouchDevice();
+    qt_handleTouchEvent(window.windowHandle(), screen, {{0, state, place, window.mapToGlobal(QPointF(place))}});
 }
 
 QPoint pointOf(const QWidget& widget, QPointF percent) {
@@ -232,8 +213,43 @@ Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QStri
     return pressDown(*hit->widget, hit->at, button);
 }
 
+ControlFinder::Held ControlFinder::pressDown(QWidget& widget, QPoint at, Qt::MouseButton button) const {
+    const QPointer<QWidget> alive(&widget);
+    QWidget* const window = widget.window();
+    const QPoint place = widget.mapTo(window, at);
+    if (window == &m_window)
+        m_last = place;
+    if (m_hand == Hand::Finger && button == Qt::LeftButton) {
+        finger(*window, place, QEventPoint::Pressed);
+        return {alive, at, button, m_hand, window, place};
+    }
+    // A widget that tracks the mouse sees it move before the press.
+    if (widget.hasMouseTracking())
+        mouse(widget, at, QEvent::MouseMove, Qt::NoButton, Qt::NoButton);
+    if (alive)
+        mouse(*alive, at, QEvent::MouseButtonPress, button, button);
+    return {alive, at, button, Hand::Mouse, window, place};
+}
+
 void ControlFinder::letGo(const Held& held) const {
-    letMouseGo(held);
+    if (held.hand == Hand::Mouse) {
+        if (held.widget && held.widget->isVisible())
+            mouse(*held.widget, held.at, QEvent::MouseButtonRelease, Qt::NoButton, held.button);
+        return;
+    }
+    if (!held.window)
+        return;
+    finger(*held.window, held.place, QEventPoint::Released);
+    // The keys rise behind the touch.
+    QCoreApplication::sendPostedEvents(m_window.findChild<FieldKeyboard*>(), QEvent::MetaCall);
+}
+
+void ControlFinder::pressAgain() const {
+    if (!m_last)
+        return;
+    QWidget* const hit = m_window.childAt(*m_last);
+    QWidget& widget = hit ? *hit : m_window;
+    click(widget, widget.mapFrom(&m_window, *m_last));
 }
 
 Result<void> ControlFinder::pressAt(const QString& page, const QString& control, QPointF percent,
@@ -241,7 +257,7 @@ Result<void> ControlFinder::pressAt(const QString& page, const QString& control,
     const Result<Held> held = hold(page, control, percent, button);
     if (!held)
         return held.failure();
-    letMouseGo(*held);
+    letGo(*held);
     return {};
 }
 
@@ -256,20 +272,27 @@ Result<void> ControlFinder::drag(const QString& page, const QString& control, QP
     if (!held)
         return held.failure();
     for (int i = 1; i <= dragMoves && held->widget; ++i) {
-        held->at = held->widget->mapFromGlobal(begin + (end - begin) * i / dragMoves);
-        mouse(*held->widget, held->at, QEvent::MouseMove, Qt::LeftButton, Qt::NoButton);
+        const QPoint now = begin + (end - begin) * i / dragMoves;
+        held->at = held->widget->mapFromGlobal(now);
+        held->place = held->window->mapFromGlobal(now);
+        if (held->hand == Hand::Finger)
+            finger(*held->window, held->place, QEventPoint::Updated);
+        else
+            mouse(*held->widget, held->at, QEvent::MouseMove, Qt::LeftButton, Qt::NoButton);
     }
-    letMouseGo(*held);
+    letGo(*held);
     return {};
 }
 
 Result<void> ControlFinder::press(const QString& page, const QString& control) const {
+    if (m_hand == Hand::Finger && page == u"keyboard"_s)
+        return touchKey(control);
     const Result<QWidget*> widget = pressable(page, control);
     if (!widget)
         return widget.failure();
     QWidget& hit = target(**widget);
     // A tick box is pressed on its box, since its label may cover the whole row.
-    click(hit, middleOf(hit));
+    click(hit, m_hand == Hand::Finger ? placeToPress(hit) : middleOf(hit));
     return {};
 }
 
@@ -283,6 +306,17 @@ Result<void> ControlFinder::type(const QString& page, const QString& control, co
         widget = box->lineEdit();
     if (!qobject_cast<QLineEdit*>(widget) && !qobject_cast<QPlainTextEdit*>(widget))
         return fail(u"%1.%2 takes no text"_s.arg(page, control));
+    if (m_hand == Hand::Finger) {
+        const Result<QString> held = this->text(page, control);
+        if (const Result<void> touched = press(page, control); !touched)
+            return touched.failure();
+        for (qsizetype i = 0; held && i < held->size(); ++i) {
+            if (const Result<void> gone = touchKey(u"keyBack"_s); !gone)
+                return gone.failure();
+        }
+        const Result<void> typed = touchType(page, control, text);
+        return typed ? touchKey(u"keyDone"_s) : typed;
+    }
     click(target(*widget), middleOf(target(*widget)));
     key(*widget, Qt::Key_A, {}, Qt::ControlModifier);
     key(*widget, Qt::Key_Delete, {});
@@ -299,33 +333,14 @@ Result<void> ControlFinder::touchKey(const QString& name) const {
         if (!whyNotPressable(*found).isEmpty())
             continue;
         m_window.presses().rest();
-        tap(*found, middleOf(*found));
+        click(*found, middleOf(*found));
         return {};
     }
     return fail(u"no key \"%1\" can be touched"_s.arg(name));
 }
 
-Result<void> ControlFinder::touch(const QString& page, const QString& control) const {
-    if (page == u"keyboard"_s)
-        return touchKey(control);
-    const Result<QWidget*> widget = pressable(page, control);
-    if (!widget)
-        return widget.failure();
-    QWidget& hit = target(**widget);
-    tap(hit, placeToPress(hit));
-    return {};
-}
-
-Result<void> ControlFinder::touchAt(const QString& page, const QString& control, QPointF percent) const {
-    const Result<Hit> hit = hitAt(page, control, percent);
-    if (!hit)
-        return hit.failure();
-    tap(*hit->widget, hit->at);
-    return {};
-}
-
 Result<void> ControlFinder::touchType(const QString& page, const QString& control, const QString& text) const {
-    if (const Result<void> touched = touch(page, control); !touched)
+    if (const Result<void> touched = press(page, control); !touched)
         return touched.failure();
     for (const QChar letter : text) {
         const QString name = letter == u' ' ? u"keySpace"_s : u"key(%1)"_s.arg(letter);
@@ -341,6 +356,28 @@ Result<void> ControlFinder::touchType(const QString& page, const QString& contro
     return {};
 }
 
+// The rows are a window of their own, which takes no press right behind the one that has opened it.
+Result<void> ControlFinder::chooseRow(QComboBox& box, int row) const {
+    if (m_hand == Hand::Mouse) {
+        box.setCurrentIndex(row);
+        Q_EMIT box.textActivated(box.itemText(row)); // these follow a press on the row
+        Q_EMIT box.activated(row);
+        return {};
+    }
+    const QPointer<QComboBox> alive(&box);
+    click(box, middleOf(box));
+    QEventLoop opening;
+    QTimer::singleShot(QApplication::doubleClickInterval() + 50, &opening, &QEventLoop::quit);
+    opening.exec();
+    if (!alive || !box.view()->isVisible())
+        return fail(u"%1 does not open"_s.arg(box.objectName()));
+    QAbstractItemView& rows = *box.view();
+    const QModelIndex index = box.model()->index(row, box.modelColumn());
+    rows.scrollTo(index);
+    click(*rows.viewport(), rows.visualRect(index).center());
+    return {};
+}
+
 Result<void> ControlFinder::choose(const QString& page, const QString& control, const QString& text) const {
     const Result<QWidget*> found = pressable(page, control);
     if (!found)
@@ -351,11 +388,7 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
             row = box->findText(text);
         if (row < 0)
             return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
-        // The popup is a window of its own; these signals follow a press on its row.
-        box->setCurrentIndex(row);
-        Q_EMIT box->textActivated(box->itemText(row));
-        Q_EMIT box->activated(row);
-        return {};
+        return chooseRow(*box, row);
     }
     if (auto* list = qobject_cast<QListWidget*>(*found)) {
         for (int row = 0; row < list->count(); ++row) {

@@ -8,28 +8,40 @@
 #include <QString>
 #include <QWidget>
 
+#include <optional>
+
+class QComboBox;
+
 namespace lumora {
 
 class MainWindow;
 class PageView;
 
+// What a person presses with. The finger types on the keys of the screen.
+enum class Hand { Mouse, Finger };
+
 // Finds controls by their design names ("Command12", "Picture1(3)") and uses them as a person does: each operation
 // fails with a reason unless the control is there, visible, enabled and not covered.
 class ControlFinder {
 public:
-    explicit ControlFinder(MainWindow& window)
-        : m_window(window) {}
+    explicit ControlFinder(MainWindow& window, Hand hand = Hand::Mouse)
+        : m_window(window)
+        , m_hand(hand) {}
 
     // The name of the page in front, "" if there is none.
     QString frontPage() const;
 
-    // Each operation takes the page's name and fails if that page is neither in front nor visible below a panel.
+    // Each operation takes the page's name and fails if that page is neither in front nor visible below a panel. For a
+    // finger the page "keyboard" is the keys on the screen.
     Result<void> press(const QString& page, const QString& control) const;
-    // A mouse button held down on a control, which may vanish before it is released.
+    // A mouse button or a finger held down on a control, which may vanish before it is released.
     struct Held {
         QPointer<QWidget> widget;
         QPoint at;
         Qt::MouseButton button = Qt::LeftButton;
+        Hand hand = Hand::Mouse;
+        QPointer<QWidget> window; // where a finger is lifted, whatever lies below it by then
+        QPoint place;             // in that window
     };
     // Points are in per cent of the control's width and height.
     Result<Held> hold(const QString& page, const QString& control) const;
@@ -42,10 +54,8 @@ public:
     Result<void> drag(const QString& page, const QString& control, QPointF from, QPointF to) const;
     // Replaces the contents of a text box.
     Result<void> type(const QString& page, const QString& control, const QString& text) const;
-    // With a finger. The page "keyboard" is the keys on the screen.
-    Result<void> touch(const QString& page, const QString& control) const;
-    Result<void> touchAt(const QString& page, const QString& control, QPointF percent) const;
-    // Touches the box, and then the keys on the screen, also those that bring other letters.
+    // With a finger, behind what the box holds: touches the box, and then the keys on the screen, also those that bring
+    // other letters.
     Result<void> touchType(const QString& page, const QString& control, const QString& text) const;
     // Chooses the row with this text in a list or a combo box.
     Result<void> choose(const QString& page, const QString& control, const QString& text) const;
@@ -62,7 +72,13 @@ public:
     // Why a mouse press in the middle of the widget would not reach it; empty if it would.
     static QString whyNotPressable(const QWidget& widget);
 
+    // Presses once more where the hand was last.
+    void pressAgain() const;
+
 private:
+    Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) const;
+    void click(QWidget& widget, QPoint at) const { letGo(pressDown(widget, at)); }
+    Result<void> chooseRow(QComboBox& box, int row) const;
     Result<void> touchKey(const QString& name) const;
     Result<PageView*> view(const QString& page) const;
     Result<QWidget*> inSight(const QString& page, const QString& control) const;
@@ -75,6 +91,8 @@ private:
     Result<Hit> hitAt(const QString& page, const QString& control, QPointF percent) const;
 
     MainWindow& m_window;
+    Hand m_hand;
+    mutable std::optional<QPoint> m_last; // in the window, where the hand was
 };
 
 } // namespace lumora

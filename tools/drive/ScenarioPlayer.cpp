@@ -9,7 +9,9 @@
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "views/kit/Overlay.h"
 #include "views/window/MainWindow.h"
+#include "views/window/PageView.h"
 #include "views/window/ScreenDialogs.h"
 
 #include <QDir>
@@ -26,6 +28,7 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr int betweenSteps = 5;         // milliseconds
+constexpr int secondPress = 100;        // milliseconds behind the first, as of a shaking or impatient hand
 constexpr double patienceOfMessage = 5; // seconds; a timer of the page may show the box
 constexpr double patienceOfWork = 900;  // seconds until work that does not end has failed
 
@@ -75,11 +78,12 @@ QString inWords(const Result<bool>& flag) {
 
 } // namespace
 
-ScenarioPlayer::ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, QString shots)
+ScenarioPlayer::ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, Manner manner)
     : m_program(program)
-    , m_controls(program.window())
+    , m_controls(program.window(), manner.hand)
+    , m_finger(program.window(), Hand::Finger)
     , m_files(std::move(files))
-    , m_shots(std::move(shots)) {
+    , m_manner(std::move(manner)) {
     m_program.dialogs().nextPick = [this] { return takePick(); };
     m_program.dialogs().nextAnswer = [this] { return takeAnswer(); };
     m_timer.setInterval(betweenSteps);
@@ -87,6 +91,10 @@ ScenarioPlayer::ScenarioPlayer(Program& program, std::vector<ScenarioFile> files
     m_letGo.setSingleShot(true);
     m_letGo.setTimerType(Qt::PreciseTimer);
     connect(&m_letGo, &QTimer::timeout, this, &ScenarioPlayer::letGo);
+    m_pressAgain.setSingleShot(true);
+    m_pressAgain.setTimerType(Qt::PreciseTimer);
+    m_pressAgain.setInterval(secondPress);
+    connect(&m_pressAgain, &QTimer::timeout, this, &ScenarioPlayer::pressAgain);
     m_atThisLine.start();
 }
 
@@ -95,7 +103,7 @@ void ScenarioPlayer::step() {
         ++m_file;
         m_command = 0;
     }
-    if (m_finished || m_held)
+    if (m_finished || m_held || m_pressAgain.isActive())
         return;
     const bool busy = m_program.platform().pump.pumping();
     if (m_file == m_files.size()) {
@@ -155,6 +163,12 @@ void ScenarioPlayer::touch(const ScenarioCommand& command) {
 
     m_program.dialogs().closeMessages();
     m_program.window().renderNow();
+    if (m_manner.pressesTwice) {
+        m_before = inFront();
+        m_pressing =
+            command.verb == ScenarioVerb::Touch || command.verb == ScenarioVerb::TouchAt ? &m_finger : &m_controls;
+        m_pressAgain.start(); // the handler may pump
+    }
     const Result<void> touched = use(command);
     if (!touched)
         fail(u"%1: the line wants to %2 %3.%4, but %5"_s.arg(here, deed(command.verb), command.page, command.control,
@@ -168,11 +182,11 @@ Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
     case ScenarioVerb::PressAt:
         return m_controls.pressAt(page, control, command.from, command.rightKey ? Qt::RightButton : Qt::LeftButton);
     case ScenarioVerb::Touch:
-        return m_controls.touch(page, control);
+        return m_finger.press(page, control);
     case ScenarioVerb::TouchAt:
-        return m_controls.touchAt(page, control, command.from);
+        return m_finger.pressAt(page, control, command.from);
     case ScenarioVerb::TouchType:
-        return m_controls.touchType(page, control, command.text);
+        return m_finger.touchType(page, control, command.text);
     case ScenarioVerb::Drag:
         return m_controls.drag(page, control, command.from, command.to);
     case ScenarioVerb::Type:
@@ -197,6 +211,22 @@ Result<void> ScenarioPlayer::use(const ScenarioCommand& command) {
 void ScenarioPlayer::letGo() {
     if (const auto held = std::exchange(m_held, std::nullopt))
         m_controls.letGo(*held);
+}
+
+// What a second press could hit that was not there for the first: a page, or a panel over it.
+QList<QPointer<const QWidget>> ScenarioPlayer::inFront() const {
+    QList<QPointer<const QWidget>> shown;
+    shown += m_program.window().frontView();
+    for (const Overlay* panel : m_program.window().findChildren<Overlay*>()) {
+        if (panel->isVisible())
+            shown += panel;
+    }
+    return shown;
+}
+
+void ScenarioPlayer::pressAgain() {
+    if (!m_program.chain().hasEnded() && inFront() != m_before)
+        m_pressing->pressAgain();
 }
 
 ScenarioPlayer::Look ScenarioPlayer::look(const ScenarioCommand& command) {
@@ -292,8 +322,8 @@ ScenarioPlayer::Look ScenarioPlayer::dump(const ScenarioCommand& command) const 
 }
 
 ScenarioPlayer::Look ScenarioPlayer::shoot(const QString& name) const {
-    const QString path = QDir(m_shots).filePath(name + u".png"_s);
-    return {QDir().mkpath(m_shots) && m_program.window().grab().save(path, "PNG"), u"the picture "_s + path,
+    const QString path = QDir(m_manner.shots).filePath(name + u".png"_s);
+    return {QDir().mkpath(m_manner.shots) && m_program.window().grab().save(path, "PNG"), u"the picture "_s + path,
             u"it can't be written"_s};
 }
 

@@ -23,8 +23,12 @@ class Program;
 class ScenarioPlayer : public QObject {
     Q_OBJECT
 public:
-    // shots: the folder of the pictures on this machine.
-    ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, QString shots);
+    struct Manner {
+        QString shots;             // the folder of the pictures on this machine
+        Hand hand = Hand::Mouse;   // of all but the lines that touch
+        bool pressesTwice = false; // once more behind each press that changes what is in front
+    };
+    ScenarioPlayer(Program& program, std::vector<ScenarioFile> files, Manner manner);
 
     void start() { m_timer.start(); }
 
@@ -53,6 +57,8 @@ private:
     void touch(const ScenarioCommand& command);
     Result<void> use(const ScenarioCommand& command);
     void letGo();
+    void pressAgain();
+    QList<QPointer<const QWidget>> inFront() const;
     Look look(const ScenarioCommand& command);
     Look lookForMessage(const QString& wanted);
     Look waitForPause(double seconds) const;
@@ -70,8 +76,9 @@ private:
 
     Program& m_program;
     ControlFinder m_controls;
+    ControlFinder m_finger;
     std::vector<ScenarioFile> m_files;
-    QString m_shots;
+    Manner m_manner;
 
     QTimer m_timer;
     std::size_t m_file = 0;
@@ -79,6 +86,9 @@ private:
     QElapsedTimer m_atThisLine;
     std::optional<ControlFinder::Held> m_held;
     QTimer m_letGo;
+    QTimer m_pressAgain;
+    QList<QPointer<const QWidget>> m_before; // what was in front before the press
+    const ControlFinder* m_pressing = nullptr;
     bool m_goesOnInTheMiddle = false;
     bool m_finished = false;
     qsizetype m_messagesTaken = 0; // index in ScreenDialogs::shownTexts

@@ -73,6 +73,9 @@ int play(int argc, char** argv) {
         {{u"lab"_s, u"The deployment file of the lab."_s, u"FILE"_s},
          {u"size"_s, u"The window, from 640x480 on."_s, u"WxH"_s, u"1280x1024"_s},
          {u"shots"_s, u"Where the pictures of shot go."_s, u"DIR"_s, u"."_s},
+         {u"touch"_s, u"Presses and types with a finger where the lines name none."_s},
+         {u"twice"_s,
+          u"Presses once more, soon and at the same place, behind each press that changes what is in front."_s},
          {u"walk"_s, u"In place of scenarios: presses what can be pressed, as this number draws it."_s, u"SEED"_s},
          {u"presses"_s, u"Of a walk, before it brings the order to its end."_s, u"NUMBER"_s, u"300"_s},
          {u"record"_s, u"Of a walk: an existing folder for what the pages showed."_s, u"DIR"_s, u"."_s}});
@@ -110,7 +113,9 @@ int play(int argc, char** argv) {
     Program program(options);
     if (const Result<void> started = program.start(); !started)
         return startFailure(started);
-    ScenarioPlayer player(program, std::move(files), parser.value(u"shots"_s));
+    ScenarioPlayer player(
+        program, std::move(files),
+        {parser.value(u"shots"_s), parser.isSet(u"touch"_s) ? Hand::Finger : Hand::Mouse, parser.isSet(u"twice"_s)});
     // quit() would close the window, which may ask the customer.
     QObject::connect(&player, &ScenarioPlayer::finished, &application, [] { QCoreApplication::exit(); });
     player.start();
