@@ -17,7 +17,8 @@ BORDERS = {'ללא מסגרת': 'NB', 'No border': 'NB', 'מסגרת לבנה': 
 WITH_MARGINS = 'כל התמונה על הנייר, עם שוליים', 'The whole picture, with margins'
 # What an album's bill shows in English, by what the order has.
 ALBUM = {'אינדיגו  סבתא': 'Indigo grandma', 'אינדיגו  ספירלה': 'Indigo spiral', 'אינדיגו הורים': 'Indigo parents', 'אינדיגו גדול': 'Indigo large',
-         'פוטו הורים': 'Photo parents', 'פוטו גדול': 'Photo large', 'חום': 'Brown', 'קרם': 'Cream', 'מבריק': 'Glossy', 'מט': 'Matte', 'משי': 'Silk'}
+         'פוטו הורים': 'Photo parents', 'פוטו גדול': 'Photo large', 'חום': 'Brown', 'קרם': 'Cream', 'מבריק': 'Glossy', 'מט': 'Matte', 'משי': 'Silk',
+         'בחר סוג נייר': 'Choose the paper'}
 EXTRAS = {'ללא': 'None', 'קנבס': 'Canvas', 'פלטה- סובלימציה': 'Sublimation plate', 'פרספקט': 'Perspex'}
 CELLS, CHUNKS, BASE, TAIL = 12, 56, 30, 40
 SAMPLE = 3  # prints of an order that are held against the customer's picture, beside those that the editor showed
@@ -242,7 +243,7 @@ class Walk:
             same('the special extras', [field(f'Tosafot2_{i}')[-2:] for i in range(1, 7)], [row[-2:] for row in bill if re.search('=[01]$', row)])
         else:
             name, telephone = details.get('Text2', field('n1')), details.get('Text3', field('n2'))
-            same('the name', field('n1'), name)
+            same('the name', field('n1'), name.rstrip())
             same('the telephone', field('n2'), telephone)
             same('the delivery address', field('n3'), details.get('Text4', field('n3')).strip())
             same('the notes', field('Hearot').rpartition(' - ')[0], closing.get('Text2', ''))

@@ -229,7 +229,7 @@ int RandomWalk::draw(int below) {
 
 void RandomWalk::walk(Program& program) {
     m_program = &program;
-    m_controls.emplace(program.window());
+    m_controls.emplace(program.window(), m_plan.hand);
     m_held.reset();
     m_acting = m_inTheMiddle = false;
     m_said = 0;

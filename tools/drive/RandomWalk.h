@@ -37,6 +37,7 @@ public:
         int presses = 0;     // before the order is brought to its end
         QStringList folders; // host paths of the folders of pictures
         QString record;      // host path of an existing folder
+        Hand hand = Hand::Mouse;
     };
     explicit RandomWalk(Plan plan);
 

@@ -97,9 +97,10 @@ int play(int argc, char** argv) {
 
     if (parser.positionalArguments().isEmpty())
         return complain(u"No scenario is named; --help tells more."_s, notPlayed);
+    const Hand hand = parser.isSet(u"touch"_s) ? Hand::Finger : Hand::Mouse;
     if (parser.isSet(u"walk"_s)) {
         RandomWalk seeded({parser.value(u"walk"_s).toUInt(), parser.value(u"presses"_s).toInt(),
-                           parser.positionalArguments(), parser.value(u"record"_s)});
+                           parser.positionalArguments(), parser.value(u"record"_s), hand});
         return walk(seeded, options);
     }
     std::vector<ScenarioFile> files;
@@ -113,9 +114,7 @@ int play(int argc, char** argv) {
     Program program(options);
     if (const Result<void> started = program.start(); !started)
         return startFailure(started);
-    ScenarioPlayer player(
-        program, std::move(files),
-        {parser.value(u"shots"_s), parser.isSet(u"touch"_s) ? Hand::Finger : Hand::Mouse, parser.isSet(u"twice"_s)});
+    ScenarioPlayer player(program, std::move(files), {parser.value(u"shots"_s), hand, parser.isSet(u"twice"_s)});
     // quit() would close the window, which may ask the customer.
     QObject::connect(&player, &ScenarioPlayer::finished, &application, [] { QCoreApplication::exit(); });
     player.start();
