@@ -283,7 +283,8 @@ FAULTS = {
           'fair pictures are called coarse'),
         F('record.isEmpty() ? EditRecord::newPicture() : record', 'EditRecord::newPicture()', 'a zoomed picture is not told to be coarse')],
     'src/selection/CardCopies.cpp': [
-        F('(copied != picture.source.stamp.length || stampOf(picture.source.file) != picture.source.stamp)', 'false', 'half a picture counts as copied')],
+        F('(copied != picture.source.stamp.length || stampOf(picture.source.file) != picture.source.stamp)', 'false', 'half a picture counts as copied',
+          told='the card must change within a copy; a cut copy is told as damaged where its print is made')],
     'src/selection/pictures/kyoskNewCopies.cpp': [
         F('count.waiting += state == CopyState::Waiting;', '', 'the card may be taken out too early')],
     'src/selection/SeenPages.cpp': [
@@ -619,8 +620,7 @@ FAULTS = {
     'src/views/kit/CaptionField.cpp': [F("type(u'\\b');", '', 'a caption can not be taken back')],
     'src/views/kit/ChoiceCards.cpp': [F('row == current', 'false', 'the chosen paper is not shown')],
     'src/views/kit/TouchKeyboard.cpp': [
-        F('m_capitals ? small.toUpper() : small', 'small', 'no name on the screen begins with a large letter'),
-        F('made->setFocusPolicy(Qt::NoFocus);', '', 'a key takes the focus, and the keys go')],
+        F('m_capitals ? small.toUpper() : small', 'small', 'no name on the screen begins with a large letter')],
     'src/views/window/FieldKeyboard.cpp': [
         F('lowest - m_keys->y()', '0', 'the field lies behind the keys'),
         F('line->echoMode() != QLineEdit::Normal', 'false', 'keys rise for what is hidden'),

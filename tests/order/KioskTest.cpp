@@ -1,5 +1,6 @@
 #include "order/CustomerTraces.h"
 
+#include "order/KioskOffer.h"
 #include "order/OrderFolder.h"
 #include "order/OrderState.h"
 #include "support/ExampleOrder.h"
@@ -57,6 +58,20 @@ TEST_F(AKioskBetweenCustomers, HasNothingOfTheOneBeforeButTheOrder) {
     EXPECT_TRUE(state.shemot.n1.isEmpty() && state.shemot.n2.isEmpty());
     EXPECT_FALSE(state.staff || state.english());
     EXPECT_EQ(state.handOver.notice, u"order 104 stays here") << "said to the one who comes";
+}
+
+TEST(AnOrderOnAKiosk, OpensByTheLastThreeDigitsOfItsTelephonesAlone) {
+    const auto opens = [](const QString& customers, const QString& photographers, const QString& digits) {
+        OrderState order;
+        order.choices = {{u"Shemot.n2"_s, customers}, {u"TelZalam"_s, photographers}, {u"Shemot.n1"_s, u"Dana 777"_s}};
+        return IsEndOfTelephone(order, digits);
+    };
+    EXPECT_TRUE(opens(u"052-765 4321"_s, {}, u"321"_s));
+    EXPECT_TRUE(opens({}, u"03-1234567"_s, u"567"_s));
+    EXPECT_FALSE(opens(u"052-7654321"_s, {}, u"210"_s));
+    EXPECT_FALSE(opens(u"052-7654321"_s, {}, u"777"_s));
+    EXPECT_FALSE(opens({}, {}, {}));
+    EXPECT_FALSE(opens(u"12"_s, {}, u"12"_s));
 }
 
 } // namespace
