@@ -53,7 +53,7 @@ HostPath doorProgram() {
 
 } // namespace
 
-// Each member uses only those above it.
+// Each member uses only those above it, as it is made.
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line, Cards::Source media)
         : deployment(std::move(read))
@@ -70,7 +70,7 @@ struct Program::Parts {
         , shell(drives)
         , chain(pump)
         , window(chain, state)
-        , dialogs(window, state, files, cards, clock)
+        , dialogs(window, state, platform)
         , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
                    cards, doorProgram()}
         , waiting(state, platform, chain, deployment)

@@ -25,14 +25,16 @@ bool writeAll(const QByteArray& bytes) {
     return true;
 }
 
-DoorStatus decode(bool draft) try {
+DoorStatus decode(std::string_view task) try {
     auto reader = StoredPictureReader::open("/proc/self/fd/" + std::to_string(doorSourceNumber));
     if (!reader)
         return doorStatusOf(reader.failure());
     if (!enterSandbox())
         return DoorStatus::NotConfined;
     QByteArray jpeg;
-    const DoorStatus made = draft ? makeDraftJpeg(**reader, jpeg) : makeUprightJpeg(**reader, jpeg);
+    const DoorStatus made = task == doorDraftOption  ? makeDraftJpeg(**reader, jpeg)
+                            : task == doorListOption ? makeListJpeg(**reader, jpeg)
+                                                     : makeUprightJpeg(**reader, jpeg);
     return jpeg.isEmpty() || writeAll(jpeg) ? made : DoorStatus::TooLarge;
 } catch (const std::bad_alloc&) {
     return DoorStatus::TooLarge;
@@ -49,7 +51,7 @@ bool limitDoorChild(int argc, char** argv) {
 
 // Ends without the destructors of what is left, which the confined process may not all run.
 void runDoorChild(int argc, char** argv) {
-    _exit(static_cast<int>(limitDoorChild(argc, argv) ? decode(argv[1] == doorDraftOption) : DoorStatus::NotConfined));
+    _exit(static_cast<int>(limitDoorChild(argc, argv) ? decode(argv[1]) : DoorStatus::NotConfined));
 }
 
 } // namespace lumora

@@ -8,8 +8,9 @@
 namespace lumora {
 
 inline constexpr std::string_view doorChildOption = "--child";
-// In its place: makes the draft alone.
+// In its place: makes the draft alone, or the small picture of a list.
 inline constexpr std::string_view doorDraftOption = "--draft";
+inline constexpr std::string_view doorListOption = "--list";
 inline constexpr int doorSourceNumber = 3;
 inline constexpr int doorTargetNumber = 4;
 

@@ -263,6 +263,14 @@ Result<Decoded> decoded(const std::filesystem::path& program, std::string_view t
     return Decoded{std::move(made), *profileIgnored};
 }
 
+Result<QByteArray> smallPicture(const Result<Decoded>& picture) {
+    if (!picture)
+        return picture.failure();
+    int error = 0;
+    const qint64 size = ::lseek(picture->file.number(), 0, SEEK_END);
+    return readPart(picture->file, 0, std::min(size, largestDraftFile), error);
+}
+
 } // namespace
 
 DoorDecoder::DoorDecoder(std::filesystem::path program, DoorLimits limits)
@@ -305,12 +313,17 @@ Result<QByteArray> DoorDecoder::draft(const std::filesystem::path& source, const
         return ofSource(header.failure());
     if (header->kind != PictureKind::Heif && header->kind != PictureKind::Avif)
         return pictureFailure(source, Failure::Kind::Unsupported, u"has no small picture"_s);
-    const auto picture = decoded(m_program, doorDraftOption, m_limits, *file, source, stop);
-    if (!picture)
-        return picture.failure();
-    int error = 0;
-    const qint64 size = ::lseek(picture->file.number(), 0, SEEK_END);
-    return readPart(picture->file, 0, std::min(size, largestDraftFile), error);
+    return smallPicture(decoded(m_program, doorDraftOption, m_limits, *file, source, stop));
+}
+
+Result<QByteArray> DoorDecoder::listed(const std::filesystem::path& source, const std::stop_token& stop) const {
+    const auto file = openSource(source, shownPath(source));
+    const auto header = file ? headerOf(*file, source) : file.failure();
+    if (!header)
+        return ofSource(header.failure());
+    if (const auto need = lumora::needOf(*header, *file, source); !need)
+        return need.failure();
+    return smallPicture(decoded(m_program, doorListOption, m_limits, *file, source, stop));
 }
 
 } // namespace lumora

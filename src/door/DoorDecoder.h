@@ -35,6 +35,9 @@ public:
     // where there is none.
     Result<QByteArray> draft(const std::filesystem::path& source, const std::stop_token& stop = {}) const;
 
+    // The same of any picture file, for a list: where it carries none, of the whole picture, decoded for it.
+    Result<QByteArray> listed(const std::filesystem::path& source, const std::stop_token& stop = {}) const;
+
 private:
     std::filesystem::path m_program;
     DoorLimits m_limits;

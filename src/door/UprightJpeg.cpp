@@ -7,6 +7,7 @@
 
 #include <QtEndian>
 
+#include <algorithm>
 #include <array>
 #include <memory>
 #include <utility>
@@ -21,6 +22,7 @@ constexpr int turnedQuality = 97;
 constexpr int decodedQuality = 95;
 constexpr int smallQuality = 85;
 constexpr int smallCell = 160;
+constexpr int listCell = 512;
 
 struct TurboReleaser {
     void operator()(void* handle) const { tjDestroy(handle); }
@@ -158,6 +160,20 @@ DoorStatus makeDraftJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
         return read;
     const Bitmap picture = onWhite(Bitmap(inSrgb(stored)));
     jpeg = picture.isNull() ? QByteArray() : encoded(picture.image(), smallQuality);
+    return jpeg.isEmpty() ? DoorStatus::TooLarge : DoorStatus::Done;
+}
+
+DoorStatus makeListJpeg(StoredPictureReader& reader, QByteArray& jpeg) {
+    if (makeDraftJpeg(reader, jpeg) == DoorStatus::Done)
+        return DoorStatus::Done;
+    StoredPicture stored;
+    if (const DoorStatus read = reader.read(stored); read != DoorStatus::Done)
+        return read;
+    Bitmap small = onWhite(Bitmap(inSrgb(stored)));
+    if (std::max(small.width(), small.height()) > listCell)
+        small = resampled(small, smallPictureSize({small.width(), small.height()}, listCell));
+    small = upright(std::move(small), stored.orientation);
+    jpeg = small.isNull() ? QByteArray() : encoded(small.image(), smallQuality);
     return jpeg.isEmpty() ? DoorStatus::TooLarge : DoorStatus::Done;
 }
 

@@ -14,4 +14,7 @@ DoorStatus makeUprightJpeg(StoredPictureReader& reader, QByteArray& jpeg);
 // The same of the small picture that a HEIC or AVIF file carries beside its own; Unsupported where there is none.
 DoorStatus makeDraftJpeg(StoredPictureReader& reader, QByteArray& jpeg);
 
+// The same of any file, for a list: where there is no small picture, of the whole one, which is decoded for it.
+DoorStatus makeListJpeg(StoredPictureReader& reader, QByteArray& jpeg);
+
 } // namespace lumora

@@ -7,6 +7,7 @@
 #include "samples/SamplePhotographs.h"
 #include "samples/SamplePictureFiles.h"
 #include "selection/door/DoorNames.h"
+#include "selection/door/ListPictures.h"
 #include "selection/door/PictureDoor.h"
 
 #include <QFile>
@@ -210,6 +211,40 @@ TEST_F(TheDoor, ShowsWhatTheHeadersHoldAtOnceAndThenThePicturesThemselves) {
     EXPECT_LT(firstSight, 1'000'000);
     for (std::size_t cell = 0; cell < cells.size(); ++cell)
         EXPECT_FALSE(isDraft(cell)) << cell;
+}
+
+TEST_F(TheDoor, ShowsPicturesOfEveryKindInAListOfFiles) {
+    put(u"plain.heic"_s, heif(picture, {}));
+    put(u"large.png"_s, saved(patches(1200, 800), "PNG"));
+    using Kind = Failure::Kind;
+    const struct {
+        const char* name;
+        QSize size = {96, 64};
+        Kind kind = Kind::Other;
+        const char* program = LUMORA_DOOR;
+    } cases[] = {
+        {"a.jpg"},
+        {"b.jpg", {64, 96}},
+        {"d.heic", {96, 60}},
+        {"plain.heic"},
+        {"large.png"},
+        {"e.jpg", {}, Kind::Damaged},
+        {"g.webp", {}, Kind::Unsupported},
+        {"large.png", {}, Kind::NoProgram, "/nowhere"},
+        {"a.jpg", {96, 64}, Kind::Other, "/nowhere"},
+    };
+    for (const auto& [name, size, kind, program] : cases) {
+        SCOPED_TRACE(name);
+        ListPictures list(program, state.door, 96);
+        std::optional<Result<Bitmap>> told;
+        QObject::connect(&list, &ListPictures::done, [&](const Result<Bitmap>& result) { told = result; });
+        list.read(host(u"C:\\p\\large.png"_s)); // left for another
+        list.read(host(u"C:\\p"_path / QString::fromLatin1(name)));
+        waitUntil([&] { return told.has_value(); });
+        ASSERT_EQ(told->ok(), !size.isEmpty());
+        EXPECT_EQ(told->ok() ? (*told)->image().size() : QSize(), size);
+        EXPECT_EQ(told->ok() ? Kind::Other : told->failure().kind, kind);
+    }
 }
 
 TEST_F(TheDoor, OpensAPictureInTheEditorOnceItIsMade) {

@@ -103,8 +103,18 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
     EXPECT_EQ(machine.drives.toDrive(media / "EOS"), u"D:\\"_path) << "known before its count";
     const Theme theme(1);
     QWidget window;
-    const PicturePicker picker(theme, &window, state, machine.files, cards, machine.clock, u"x"_s, {}, {},
-                               Dialogs::Offer::Pictures);
+    const Platform platform{machine.files,
+                            machine.dialogs,
+                            machine.noInternet,
+                            machine.mail,
+                            machine.shell,
+                            machine.clock,
+                            machine.pump,
+                            machine.volume,
+                            machine.instances,
+                            cards,
+                            {}};
+    const PicturePicker picker(theme, &window, state, platform, u"x"_s, {}, {}, Dialogs::Offer::Pictures);
     const auto* grid = picker.findChild<QListWidget*>(u"pickerGrid"_s);
     QStringList rows;
     for (int row = 0; row < grid->count(); ++row)

@@ -32,7 +32,7 @@ struct KioskWindow : ::testing::Test, PageRig {
 
     Theme theme{1};
     MainWindow window{chain, state};
-    ScreenDialogs dialogs{window, state, machine.files, machine.cards, machine.clock};
+    ScreenDialogs dialogs{window, state, platform};
     Platform platform{machine.files,
                       dialogs,
                       machine.noInternet,
@@ -70,8 +70,8 @@ TEST_F(KioskWindow, PicksFromCardsAndSticksAlone) {
     const HostPath media = machine.drives.dataFolder().parent_path() / "media";
     const auto offered = [&](bool staffIsThere) {
         state.staff = staffIsThere;
-        const PicturePicker picker(theme, &window, state, machine.files, machine.cards, machine.clock, u"pick"_s,
-                                   machine.drives.programRoot(), {}, Dialogs::Offer::Pictures);
+        const PicturePicker picker(theme, &window, state, machine.platform, u"pick"_s, machine.drives.programRoot(), {},
+                                   Dialogs::Offer::Pictures);
         QStringList names;
         for (const auto* place : picker.findChildren<QAbstractButton*>(QRegularExpression(u"^place"_s)))
             names += place->toolTip();

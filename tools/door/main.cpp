@@ -38,7 +38,7 @@ void complain(const QString& text) {
 } // namespace
 
 int main(int argc, char** argv) {
-    if (argc > 1 && (argv[1] == doorChildOption || argv[1] == doorDraftOption))
+    if (argc > 1 && (argv[1] == doorChildOption || argv[1] == doorDraftOption || argv[1] == doorListOption))
         runDoorChild(argc, argv);
     std::vector<std::string> arguments(argv + 1, argv + argc);
     const std::string first = arguments.empty() ? std::string() : arguments.front();

@@ -3,11 +3,12 @@
 #include "common/AnsiCodePage.h"
 #include "common/PictureName.h"
 #include "platform/Machine.h"
+#include "platform/Platform.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
 #include "selection/CardWords.h"
-#include "selection/door/FolderPicture.h"
 #include "session/SessionState.h"
+#include "session/SharedWords.h"
 #include "views/kit/CardOffer.h"
 #include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
@@ -71,13 +72,18 @@ public:
             drawImage(*painter, box, picture);
         } else {
             const bool folder = index.data(FolderRole).toBool();
-            const QString icon = folder                            ? u"folder"_s
-                                 : index.data(PlainRole).toBool()  ? u"document"_s
-                                 : index.data(BrokenRole).toBool() ? u"warning"_s
-                                                                   : u"picture"_s;
-            drawIcon(*painter, box.center(),
-                     m_theme.icon(icon, folder ? m_theme.px(68) : m_theme.size(IconSize::Box),
-                                  folder ? Theme::Colour::Primary : Theme::Colour::Muted));
+            const QString broken = index.data(BrokenRole).toString();
+            const QString icon = folder                           ? u"folder"_s
+                                 : index.data(PlainRole).toBool() ? u"document"_s
+                                 : !broken.isEmpty()              ? u"warning"_s
+                                                                  : u"picture"_s;
+            const int side = folder ? m_theme.px(68) : m_theme.size(IconSize::Box);
+            const QRectF words = broken.isEmpty() ? QRectF() : box.adjusted(0, box.height() / 2, 0, 0);
+            drawIcon(*painter, box.center() - QPointF(0, words.height() / 2),
+                     m_theme.icon(icon, side, folder ? Theme::Colour::Primary : Theme::Colour::Muted));
+            painter->setFont(m_theme.font(Theme::Type::Small));
+            painter->setPen(Theme::Colour::Muted);
+            painter->drawText(words, Qt::AlignCenter | Qt::TextWordWrap, broken);
         }
         painter->setFont(m_theme.font(Theme::Type::Small));
         painter->setPen(Theme::Colour::Ink);
@@ -123,10 +129,6 @@ QString nameOf(const HostPath& path) {
     return toText(path.filename());
 }
 
-bool isJpeg(const HostPath& path) {
-    return isPictureFile(nameOf(path));
-}
-
 // The picker opens at the first place that holds anything, not at the last folder: that may be another customer's.
 bool holdsAnything(const HostPath& folder) {
     std::error_code error;
@@ -136,16 +138,17 @@ bool holdsAnything(const HostPath& folder) {
 
 } // namespace
 
-PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files,
-                             Cards& cards, const Clock& clock, const QString& prompt, const DrivePath& initialFolder,
-                             const QString& title, Dialogs::Offer offer)
+PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Platform& platform,
+                             const QString& prompt, const DrivePath& initialFolder, const QString& title,
+                             Dialogs::Offer offer)
     : Overlay(theme, parent)
     , m_theme(theme)
     , m_state(state)
-    , m_files(files)
-    , m_cards(cards)
-    , m_clock(clock)
-    , m_offer(offer) {
+    , m_files(platform.files)
+    , m_cards(platform.cards)
+    , m_clock(platform.clock)
+    , m_offer(offer)
+    , m_pictures(platform.doorProgram, state.door, static_cast<int>(theme.size(Extent::Field) * devicePixelRatioF())) {
     setObjectName(u"picturePicker"_s);
     setAccessibleName(title.isEmpty() ? prompt : title);
     setFilling();
@@ -180,8 +183,7 @@ PicturePicker::PicturePicker(const Theme& theme, QWidget* parent, const SessionS
     addButtons(back, m_take);
     whenEscaped(cancel);
     setFirstFocus(m_grid);
-    m_reader.setInterval(0);
-    connect(&m_reader, &QTimer::timeout, this, &PicturePicker::readNext);
+    connect(&m_pictures, &ListPictures::done, this, &PicturePicker::showPicture);
     open(firstFolder(initialFolder));
 }
 
@@ -390,7 +392,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initial
 
 void PicturePicker::open(const HostPath& folder) {
     m_folder = folder;
-    m_reader.stop();
+    m_pictures.stop();
     m_unread.clear();
     m_grid->clear();
     m_take->setEnabled(false);
@@ -443,8 +445,7 @@ void PicturePicker::open(const HostPath& folder) {
                                                      u"There are no pictures here. Choose another place."_s));
     if (m_grid->count() > 0)
         m_grid->setCurrentRow(m_grid->item(0)->data(HeadingRole).toBool() ? 1 : 0, QItemSelectionModel::NoUpdate);
-    if (!m_unread.empty())
-        m_reader.start();
+    readNext();
 }
 
 bool PicturePicker::isPicture(const HostPath& path) const {
@@ -485,10 +486,8 @@ void PicturePicker::addByDays(const std::vector<HostPath>& files) {
 }
 
 void PicturePicker::readNext() {
-    if (m_unread.empty()) {
-        m_reader.stop();
+    if (m_unread.empty())
         return;
-    }
     // The rows in view are read first.
     auto next = m_unread.begin();
     const QRect seen = m_grid->viewport()->rect();
@@ -501,14 +500,21 @@ void PicturePicker::readNext() {
         if (cell.top() > seen.bottom())
             break;
     }
-    QListWidgetItem* item = m_grid->item(*next);
+    m_reading = *next;
     m_unread.erase(next);
-    const HostPath path(item->data(PathRole).toByteArray().toStdString());
-    const Bitmap picture = folderPicture(path, m_theme.size(Extent::Field), m_state.door);
-    if (!picture.isNull())
-        item->setData(PictureRole, picture.image());
-    else if (isJpeg(path))
-        item->setData(BrokenRole, true); // of another kind only the door knows
+    m_pictures.read(HostPath(m_grid->item(m_reading)->data(PathRole).toByteArray().toStdString()));
+}
+
+void PicturePicker::showPicture(const Result<Bitmap>& picture) {
+    QListWidgetItem* item = m_grid->item(m_reading);
+    if (picture) {
+        item->setData(PictureRole, picture->image());
+    } else {
+        const QString words = failureWords(m_state, picture.failure());
+        item->setData(BrokenRole, words);
+        item->setData(Qt::AccessibleTextRole, QString(item->text() + u", "_s + words));
+    }
+    readNext();
 }
 
 void PicturePicker::activate(const QListWidgetItem* item) {

@@ -4,11 +4,10 @@
 #include "platform/files/CustomersMedia.h"
 #include "platform/files/HostPath.h"
 #include "platform/media/Cards.h"
+#include "selection/door/ListPictures.h"
 #include "views/kit/Overlay.h"
 
-#include <QImage>
 #include <QListWidget>
-#include <QTimer>
 
 #include <array>
 #include <deque>
@@ -21,20 +20,19 @@ class CardOffer;
 class Clock;
 class ElidedLabel;
 class Files;
+struct Platform;
 struct SessionState;
 
-// The picker of one picture: the places at the side, memory cards first, and a grid of the folders and JPEG files of
-// the place that is open. A click chooses, a double click or Enter takes it. Small pictures are read one after another
-// once the grid stands, those in view first, so that a folder of thousands opens at once. Where every file is on offer,
-// other files show by a sign. Where the lab has cards watched, those that are in stand above, and pictures stand by
-// days.
+// The picker of one picture: the places at the side, memory cards first, and a grid of the folders and pictures of the
+// place that is open. A click chooses, a double click or Enter takes it. Small pictures are read in the background, one
+// after another, those in view first, so that a folder of thousands opens at once. Where every file is on offer, other
+// files show by a sign. Where the lab has cards watched, those that are in stand above, and pictures stand by days.
 class PicturePicker : public Overlay {
     Q_OBJECT
 public:
     // The picker opens at initialFolder when no better place is known.
-    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Files& files, Cards& cards,
-                  const Clock& clock, const QString& prompt, const DrivePath& initialFolder, const QString& title,
-                  Dialogs::Offer offer);
+    PicturePicker(const Theme& theme, QWidget* parent, const SessionState& state, const Platform& platform,
+                  const QString& prompt, const DrivePath& initialFolder, const QString& title, Dialogs::Offer offer);
 
 Q_SIGNALS:
     // The drive path of the picture as the code page has it ("?" for what it lacks); empty for a cancel.
@@ -69,6 +67,7 @@ private:
     void activate(const QListWidgetItem* item);
     void take();
     void readNext();
+    void showPicture(const Result<Bitmap>& picture);
     bool isPicture(const HostPath& path) const;
     QString pathText(const HostPath& path) const;
 
@@ -95,7 +94,8 @@ private:
     QPushButton* m_up;
     QPushButton* m_take;
     QListWidget* m_grid;
-    QTimer m_reader;
+    ListPictures m_pictures;
+    int m_reading = -1;       // the row whose small picture is being read
     std::deque<int> m_unread; // rows whose small picture is still to be read
 };
 

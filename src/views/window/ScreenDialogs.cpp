@@ -11,13 +11,10 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files, Cards& cards,
-                             const Clock& clock)
+ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Platform& platform)
     : m_window(window)
     , m_state(state)
-    , m_files(files)
-    , m_cards(cards)
-    , m_clock(clock) {}
+    , m_platform(platform) {}
 
 ScreenDialogs::~ScreenDialogs() = default;
 
@@ -105,8 +102,7 @@ DrivePath ScreenDialogs::pickFile(const QString& prompt, const DrivePath& initia
         if (const std::optional<DrivePath> pick = nextPick())
             return *pick;
     }
-    PicturePicker picker(m_window.theme(), &m_window, m_state, m_files, m_cards, m_clock, prompt, initialFolder, title,
-                         offer);
+    PicturePicker picker(m_window.theme(), &m_window, m_state, m_platform, prompt, initialFolder, title, offer);
     picker.setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     QEventLoop loop;
     QString chosen;

@@ -13,11 +13,9 @@ class QEventLoop;
 
 namespace lumora {
 
-class Cards;
-class Clock;
-class Files;
 class MainWindow;
 class MessagePanel;
+struct Platform;
 struct SessionState;
 
 // The boxes of the program as panels over the page. Messages queue up and the page goes on below them; a question and
@@ -25,7 +23,8 @@ struct SessionState;
 class ScreenDialogs : public QObject, public Dialogs {
     Q_OBJECT
 public:
-    ScreenDialogs(MainWindow& window, const SessionState& state, const Files& files, Cards& cards, const Clock& clock);
+    // The platform may name these boxes as its own; nothing of it is used before the picker opens.
+    ScreenDialogs(MainWindow& window, const SessionState& state, const Platform& platform);
     ~ScreenDialogs() override;
 
     void message(const QString& text, const QString& title = {}) override;
@@ -62,9 +61,7 @@ private:
 
     MainWindow& m_window;
     const SessionState& m_state;
-    const Files& m_files;
-    Cards& m_cards;
-    const Clock& m_clock;
+    const Platform& m_platform;
     QList<Box> m_waiting;
     QPointer<MessagePanel> m_panel;
     QList<QEventLoop*> m_answers; // loops that wait for one; a loop's box has said no as long as nobody has answered
