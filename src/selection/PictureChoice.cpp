@@ -39,6 +39,24 @@ void PictureChoice::nextPage() {
     if (!hasNextPage())
         return;
     m_seen.seen({SeenPages::Of::Folders, m_folders.currentIndex()});
+    readFolderPage();
+}
+
+bool PictureChoice::hasPreviousPage() const {
+    const bool ofFolders = m_inView && m_inView->of == SeenPages::Of::Folders;
+    return !m_folders.isEmpty() && m_seen.hasPrevious(ofFolders ? std::optional(m_inView->start) : std::nullopt);
+}
+
+std::optional<PictureChoice::Range> PictureChoice::range() const {
+    if (!m_inView || m_page.isEmpty())
+        return std::nullopt;
+    const int shown = m_page.count();
+    const int all = m_inView->of == SeenPages::Of::Folders ? m_folders.count() : m_basket.count();
+    return Range{m_inView->of, m_inView->start, shown, std::max(all, m_inView->start + shown)};
+}
+
+void PictureChoice::readFolderPage() {
+    m_inView = {SeenPages::Of::Folders, m_folders.currentIndex()};
     turnTo(m_folders.FillPageList());
 }
 
@@ -46,10 +64,10 @@ void PictureChoice::previousPage() {
     const std::optional<SeenPages::Page> before = m_seen.goBack(m_basket.count());
     if (!before) {
         m_folders.PageBack();
-        turnTo(m_folders.FillPageList());
+        readFolderPage();
     } else if (before->of == SeenPages::Of::Folders) {
         m_folders.setCurrentIndex(before->start);
-        turnTo(m_folders.FillPageList());
+        readFolderPage();
     } else {
         m_basket.setCurrentIndex(before->start);
         readChosenPage();
@@ -70,6 +88,7 @@ void PictureChoice::readChosenPage() {
         return line.trimmed().isEmpty() ? QString() : line.mid(column);
     });
     m_basket.setCurrentIndex(m_seen.behindChosenPage(start, index, m_basket.count()));
+    m_inView = {SeenPages::Of::Chosen, start};
     turnTo(paths);
 }
 
@@ -83,6 +102,7 @@ void PictureChoice::showAlone(const QStringList& paths) {
         next.resize(std::min<qsizetype>(next.size(), cellsOfPage));
     }
     m_shownAlone += next;
+    m_inView.reset();
     turnTo(next);
 }
 
@@ -106,6 +126,7 @@ void PictureChoice::clear() {
     m_basket.clear();
     m_seen.clear();
     m_shownAlone.clear();
+    m_inView.reset();
     turnTo({});
 }
 

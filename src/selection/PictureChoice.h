@@ -44,7 +44,16 @@ public:
 
     int addFolder(const DrivePath& folder, const QStringList& names) { return m_folders.addFolder(folder, names); }
     // False when the page behind the last one is asked for and there is none.
-    bool hasNextPage() const { return m_seen.hasNext(m_folders); }
+    bool hasNextPage() const { return !m_folders.isEmpty() && m_seen.hasNext(m_folders); }
+    bool hasPreviousPage() const;
+    // Which pictures are in view, among those of the folders or of the basket; none for a page of some alone.
+    struct Range {
+        SeenPages::Of of;
+        int start;
+        int count;
+        int all;
+    };
+    std::optional<Range> range() const;
     void nextPage();
     void previousPage();
     // A page of the basket's own pictures, from its reading position on.
@@ -79,6 +88,7 @@ public:
 private:
     PrintCode code(int copies, PaperWords words);
     void put(const BasketLine& line);
+    void readFolderPage();
     void readChosenPage();
     void turnTo(const QStringList& paths);
 
@@ -88,7 +98,8 @@ private:
     FolderPager m_folders;
     SeenPages m_seen;
     TextList m_page;
-    QStringList m_shownAlone; // paths, in this round
+    std::optional<SeenPages::Page> m_inView; // none for a page of some pictures alone
+    QStringList m_shownAlone;                // paths, in this round
     std::array<int, cellsOfPage> m_copies{};
     QChar m_paper = u' '; // the letter of the line before, for a paper word that is not known
 };

@@ -37,6 +37,10 @@ bool SeenPages::hasNext(const FolderPager& folders) const {
     return !m_state.Careful || !folders.isAtEnd();
 }
 
+bool SeenPages::hasPrevious(std::optional<int> start) const {
+    return m_state.Careful ? m_pages.size() > 1 : start != 0;
+}
+
 int SeenPages::behindChosenPage(int start, int position, int lines) const {
     return m_state.Careful && start + cellsOfPage >= lines ? 0 : position;
 }

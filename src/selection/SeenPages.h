@@ -30,6 +30,9 @@ public:
     // The page that was seen before the one in view; the first stays. No value as built in.
     std::optional<Page> goBack(int lines);
     bool hasNext(const FolderPager& folders) const;
+    // False where goBack() would show the page in view again. start: its first picture of the folders, if it is of
+    // them.
+    bool hasPrevious(std::optional<int> start) const;
     // The reading position behind a page of chosen pictures. position: where the reading stopped.
     int behindChosenPage(int start, int position, int lines) const;
 

@@ -257,6 +257,11 @@ TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
         EXPECT_EQ(at.choice.path(0), u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
         EXPECT_EQ(at.choice.page().count(), c.count) << c.careful << c.presses;
         EXPECT_EQ(at.choice.hasNextPage(), !c.careful || at.choice.path(c.count - 1) != u"C:\\p\\40.jpg"_s);
+        const auto range = at.choice.range();
+        EXPECT_EQ(range ? range->start + 1 : 7, c.first.toInt()) << c.careful << c.presses;
+        const bool hasPrevious = at.choice.hasPreviousPage();
+        at.choice.previousPage();
+        EXPECT_EQ(hasPrevious, at.choice.path(0) != u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
     }
 }
 

@@ -35,6 +35,7 @@ TEST_P(PageLook, HasNoFaultFromThePicturesToTheSending) {
     go(walk, toDetails + toOptions + toBorder + toTerms + toPictures + u":10-no-pictures"_s);
     lookAtPicker(walk, u"kyoskNew"_s, u"Image5"_s, u"11-picker"_s);
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
+    EXPECT_EQ(focusName(), u"Picture1(0)"_s);
     go(walk, u"Picture1(0) Picture1(1) Picture1(4) Command12(1) :12-pictures changeDetails>nnn :12-change Command4 "
              ":12-change-details Command12 Command8 Command6 :12-changed Command3>kyoskNew Picture2>Form3 :12-upright "
              "Command1 "

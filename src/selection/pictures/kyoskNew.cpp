@@ -116,7 +116,9 @@ void kyoskNew::showChoice() {
     List2 = m_choice.page();
     List4 = m_choice.folders().paths();
     Label7.text = QString::number(m_choice.basket().SumCopies());
+    Image15.enabled = m_choice.hasPreviousPage();
     Image16.enabled = m_choice.hasNextPage();
+    showRange();
     for (int cell = 0; cell < cellsOfPage; ++cell)
         showCell(cell);
     copyChosen(false);
@@ -157,10 +159,6 @@ void kyoskNew::showCell(int cell) {
 void kyoskNew::takeInHand(const QString& path) {
     m_largePath = DrivePath(path);
     Label1.text = Label2.text = shownPath(path).text();
-}
-
-void kyoskNew::setScreenHeight(int pixels) {
-    m_cellSize = pixels < 700 ? 90 : 115;
 }
 
 void kyoskNew::askToLeave() {

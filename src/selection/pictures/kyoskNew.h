@@ -49,11 +49,9 @@ public:
 
     // --- events ---
 
-    // The height of the screen in logical pixels: below 700 a cell has 90, otherwise 115.
-    void setScreenHeight(int pixels);
-    // How many real pixels a cell has on this screen; the large view follows in proportion. Draws the page again only
-    // if it changed.
-    void setCellPixels(int pixels);
+    // How many real pixels the longer side of a small and of the large picture has on this screen. Draws the page again
+    // only if the first changed.
+    void setCellPixels(int pixels, int large);
 
     // The cells, 0 to 11. An empty one does nothing.
     void Picture1_Click(int cell) { choosePicture(cell); }
@@ -263,6 +261,7 @@ private:
     void closeBranches();
     bool homeAddressKnown();
     void focusOn(const QString& box);
+    void focusOnFirstPicture();
     void setDeepCompression(bool deep);
     void type(Caption& box, const QString& text) { box.text = text; }
     void typeAlbumMail(const QString& text);
@@ -277,6 +276,7 @@ private:
     void setClosingTexts();
     void setPaperTexts();
     void setCoarseTexts();
+    void showRange();
 
     SessionState& m_state;
     const Platform& m_platform;
@@ -301,8 +301,8 @@ private:
     DrivePath m_cardPicture; // the newest of the card that is offered; empty when none can be opened
     Ticker Timer1;
     Ticker Timer2;
-    int m_cellSize = 115;   // logical pixels
-    int m_cellPixels = 115; // of this screen
+    int m_cellPixels = 115;
+    double m_largeScale = 1;
     int m_openCell = -1;
     int m_rotation = 0;                     // of the large view: 0, 90, 180, 270
     unsigned m_drawing = 0;                 // the number of the latest redraw

@@ -31,7 +31,8 @@ HostPath kyoskNew::hostOf(const DrivePath& path) const {
     return KeptPictures(m_platform.files, m_state.keptFolder).hostOf(path).value_or(HostPath());
 }
 
-void kyoskNew::setCellPixels(int pixels) {
+void kyoskNew::setCellPixels(int pixels, int large) {
+    m_largeScale = large / 400.0;
     if (pixels < 1 || pixels == m_cellPixels)
         return;
     m_cellPixels = pixels;
@@ -112,7 +113,15 @@ void kyoskNew::showFolderOf(const DrivePath& picture) {
         showFolderOffer();
     showGuide(Guide::PicturesShown);
     m_choice.nextPage();
+    focusOnFirstPicture();
     drawPage();
+}
+
+void kyoskNew::focusOnFirstPicture() {
+    for (int cell = 0; cell < m_choice.page().count(); ++cell) {
+        if (!m_door->isUnreadable(m_choice.path(cell)))
+            return focusOn(u"Picture1(%1)"_s.arg(cell));
+    }
 }
 
 void kyoskNew::takeFolderOf(const DrivePath& picture) {
@@ -254,8 +263,7 @@ void kyoskNew::showLarge(const DrivePath& path) {
     if (!size)
         return;
     const PictureSize view = largeViewSize(*size);
-    const double scale = static_cast<double>(m_cellPixels) / m_cellSize;
-    const auto pixels = [scale](int units) { return std::max(1, static_cast<int>(std::lround(units * scale))); };
+    const auto pixels = [this](int units) { return std::max(1, static_cast<int>(std::lround(units * m_largeScale))); };
     // A quarter turn exchanges the sides of the view; the picture keeps its proportions.
     const Result<Bitmap> picture = loadPictureScaled(host, {pixels(view.width), pixels(view.height)});
     if (!picture)

@@ -78,9 +78,10 @@ struct kyoskNewControls : Controls {
     Caption Label29{*this, u"Label29"};                      // the folder picked last
     Caption Label34{*this, u"Label34"};                      // how many pictures it and those before have
     Caption Label34Prompt{*this, u"Label34Prompt"};
-    Caption pictureCount{*this, u"pictureCount"};          // the same in words
-    Caption Label9{*this, u"Label9"};                      // help
-    Caption Frame2{*this, u"Frame2", Caption::At::Hidden}; // its panel
+    Caption pictureCount{*this, u"pictureCount"};                // the same in words
+    Caption pageRange{*this, u"pageRange", Caption::At::Hidden}; // which of them are in view
+    Caption Label9{*this, u"Label9"};                            // help
+    Caption Frame2{*this, u"Frame2", Caption::At::Hidden};       // its panel
     Caption helpClose{*this, u"helpClose"};
     Caption emptyHead{*this, u"emptyHead"}; // while no folder is picked
     Caption firstFolder{*this, u"firstFolder"};

@@ -163,6 +163,19 @@ void kyoskNew::setClosingTexts() {
         setCaptions(m_state, {{Command7, u"המשך ללא כתובת דואר", u"Continue without my address"}});
 }
 
+void kyoskNew::showRange() {
+    const auto range = m_choice.range();
+    pageRange.visible = range.has_value();
+    if (!range)
+        return;
+    const QString numbers = range->count == 1 ? QString::number(range->start + 1)
+                                              : u"%1-%2"_s.arg(range->start + 1).arg(range->start + range->count);
+    pageRange.text = (range->of == SeenPages::Of::Folders ? m_state.wording(u"%1 מתוך %2", u"%1 of %2")
+                                                          : m_state.wording(u"%1 מתוך %2 שנבחרו", u"%1 of %2 chosen"))
+                         .arg(numbers)
+                         .arg(range->all);
+}
+
 void kyoskNew::showGuide(Guide guide) {
     m_guide = guide;
     const auto lines = [this](const char16_t* hebrew, const char16_t* english) {

@@ -5,6 +5,8 @@
 
 #include <QWidget>
 
+#include <algorithm>
+
 namespace lumora {
 
 // The large view of the picture page: the picture on its paper with the warning of low quality, or lines of guidance. A
@@ -14,6 +16,8 @@ class LargePicture : public QWidget {
 public:
     LargePicture(const Theme& theme, QWidget* parent);
     void show(const LargeView& view);
+    // In pixels of the screen.
+    int longerSide() const { return static_cast<int>(std::max(width(), height()) * devicePixelRatioF()); }
 
 Q_SIGNALS:
     void clicked();

@@ -4,6 +4,7 @@
 #include "views/picture/ResolutionBadge.h"
 
 #include <QKeyEvent>
+#include <QPainterPath>
 
 #include <algorithm>
 
@@ -14,6 +15,7 @@ using namespace Qt::StringLiterals;
 PictureCell::PictureCell(const Theme& theme, QWidget* parent)
     : CardButton(theme, parent) {
     setCardSize({146, 160});
+    setMinimumWidth(3 * theme.key() + 2 * theme.thick());
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     const Maker make(theme, this);
     const auto key = [&](const QString& icon) {
@@ -42,6 +44,7 @@ void PictureCell::setCopiesTyped(bool typed) {
 
 void PictureCell::show(const Look& look) {
     m_look = look;
+    fitPicture();
     m_strip->setVisible(look.chosen);
     m_copies->setText(look.copies.trimmed());
     setEnabled(look.filled && look.unreadable.isEmpty());
@@ -49,21 +52,37 @@ void PictureCell::show(const Look& look) {
 }
 
 QRect PictureCell::pictureRoom() const {
-    const int inset = theme().size(Space::Small);
-    const int strip = theme().key();
-    return rect().adjusted(inset, inset, -inset, -inset - strip);
+    const int inset = theme().thick();
+    return rect().adjusted(inset, inset, -inset, -inset);
 }
 
 int PictureCell::pictureSide() const {
     const QRect room = pictureRoom();
-    return static_cast<int>(std::min(room.width(), room.height()) * devicePixelRatioF());
+    return static_cast<int>(std::max(room.width(), room.height()) * devicePixelRatioF());
+}
+
+int PictureCell::nameHeight() const {
+    return QFontMetrics(theme().font(Theme::Type::Small)).height() + theme().size(Space::Small);
+}
+
+// Scaled once, and not at each painting.
+void PictureCell::fitPicture() {
+    const QSize room = pictureRoom().size() * devicePixelRatioF();
+    const QSize size = m_look.picture.size();
+    const bool fits = size.width() <= room.width() && size.height() <= room.height();
+    if (m_look.picture.isNull() || room.isEmpty()) {
+        m_fitted = QImage();
+        return;
+    }
+    m_fitted = fits ? m_look.picture : m_look.picture.scaled(room, Qt::KeepAspectRatio, Qt::SmoothTransformation);
+    m_fitted.setDevicePixelRatio(devicePixelRatioF());
 }
 
 void PictureCell::resizeEvent(QResizeEvent*) {
-    const int inset = theme().thick() + theme().hair();
-    const int height = theme().key();
     Q_EMIT resized();
-    m_strip->setGeometry(inset, rect().height() - inset - height, width() - 2 * inset, height);
+    fitPicture();
+    const QRect room = pictureRoom();
+    m_strip->setGeometry(room.left(), room.bottom() + 1 - theme().key(), room.width(), theme().key());
 }
 
 void PictureCell::keyPressEvent(QKeyEvent* event) {
@@ -111,34 +130,45 @@ void PictureCell::paintEvent(QPaintEvent*) {
                                  theme().corner());
     if (!m_look.filled)
         return;
-    const QRect room = pictureRoom();
-    QPointF mark = room.bottomLeft();
-    if (!m_look.picture.isNull()) {
-        const double ratio = devicePixelRatioF();
-        QSizeF size = QSizeF(m_look.picture.size()) / ratio;
-        if (size.width() > room.width() || size.height() > room.height())
-            size.scale(room.size(), Qt::KeepAspectRatio);
-        QRectF at(QPointF(), size);
-        at.moveCenter(QRectF(room).center());
-        // The picture begins on a whole pixel; between pixels it would be drawn blurred.
-        at.moveTopLeft(QPointF(at.topLeft().toPoint()));
-        painter.fillRect(at.translated(theme().hair(), theme().hair()), QColor(0, 0, 0, 30));
-        painter.drawImage(at, m_look.picture);
-        mark = at.bottomLeft() + QPointF(-theme().px(6), theme().px(12));
+    const QRectF room = pictureRoom();
+    QRectF band = room;
+    band.setTop(room.bottom() - (m_look.chosen ? theme().key() : nameHeight()));
+    painter.save();
+    QPainterPath inside;
+    inside.addRoundedRect(room, theme().corner() - theme().thick(), theme().corner() - theme().thick());
+    painter.setClipPath(inside);
+    if (!m_fitted.isNull()) {
+        const QSizeF size = m_fitted.deviceIndependentSize();
+        const double free = room.height() - size.height();
+        // Above the name where there is room, and there it stays when it is chosen. The picture begins on a whole
+        // pixel; between pixels it would be drawn blurred.
+        const QPointF at(room.left() + (room.width() - size.width()) / 2,
+                         room.top() + std::max(0.0, free - nameHeight()) / 2);
+        painter.drawImage(at.toPoint(), m_fitted);
     } else {
         const QString icon = m_look.waiting ? u"clock"_s : m_look.unreadable.isEmpty() ? u"picture"_s : u"warning"_s;
-        drawIcon(painter, QRectF(room).center(), theme().icon(icon, theme().size(IconSize::Box), Theme::Colour::Edge));
+        drawIcon(painter, room.center() - QPointF(0, band.height() / 2),
+                 theme().icon(icon, theme().size(IconSize::Box), Theme::Colour::Edge));
     }
+    painter.setFont(theme().font(Theme::Type::Small));
     if (!m_look.unreadable.isEmpty()) {
-        painter.setFont(theme().font(Theme::Type::Small));
         painter.setPen(Theme::Colour::Muted);
-        painter.drawText(QRectF(room.left(), room.center().y() + theme().size(IconSize::Box) / 2.0, room.width(),
-                                room.height() / 2.0 - theme().size(IconSize::Box) / 2.0),
-                         Qt::AlignHCenter | Qt::AlignTop | Qt::TextWordWrap, m_look.unreadable);
+        painter.drawText(QRectF(room.left(), room.center().y(), room.width(), band.top() - room.center().y()),
+                         Qt::AlignCenter | Qt::TextWordWrap, m_look.unreadable);
     }
+    // Words on any picture keep their contrast.
+    QColor veil = m_look.chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface;
+    veil.setAlpha(230);
+    painter.fillRect(band, veil);
+    painter.setPen(Theme::Colour::Ink);
+    const double beside = theme().size(Space::Small);
+    if (!m_look.chosen)
+        painter.drawText(band, Qt::AlignCenter,
+                         fromLeft(painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle,
+                                                                   static_cast<int>(band.width() - 2 * beside))));
+    painter.restore();
     if (m_look.resolution.visible)
-        drawResolution(painter, theme(),
-                       {std::max<double>(mark.x(), room.left()), std::min<double>(mark.y(), room.bottom())},
+        drawResolution(painter, theme(), {room.left() + beside, band.top() - theme().size(Space::Tight)},
                        m_look.resolution);
     if (m_look.chosen || m_look.inEditor)
         drawMark(painter, theme(), card,
@@ -148,15 +178,6 @@ void PictureCell::paintEvent(QPaintEvent*) {
                   .radius = 14,
                   .inset = 5,
                   .rim = 2});
-    if (!m_look.chosen) {
-        painter.setFont(theme().font(Theme::Type::Small));
-        painter.setPen(Theme::Colour::Muted);
-        const int beside = theme().size(Space::Small);
-        const QRectF line(beside, m_strip->y(), width() - 2 * beside, m_strip->height());
-        painter.drawText(
-            line, Qt::AlignCenter,
-            fromLeft(painter.fontMetrics().elidedText(m_look.name, Qt::ElideMiddle, static_cast<int>(line.width()))));
-    }
 }
 
 } // namespace lumora

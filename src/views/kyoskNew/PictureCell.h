@@ -7,8 +7,9 @@ class QPushButton;
 
 namespace lumora {
 
-// One of the twelve small pictures. A press chooses it; a chosen one has a mark, and minus, the number of copies and
-// plus below. The keys + and - count too, and the arrows go to the neighbours.
+// One of the twelve small pictures, as large as its cell takes it, with the name over its lower edge. A press chooses
+// it; a chosen one has a mark, and minus, the number of copies and plus in the place of the name. The keys + and -
+// count too, and the arrows go to the neighbours.
 class PictureCell : public CardButton {
     Q_OBJECT
 public:
@@ -33,7 +34,7 @@ public:
     // A press of the number is one of its own, and not of the picture.
     void setCopiesTyped(bool typed);
     QWidget* mark() const { return m_strip; }
-    // Side of the square that is left for the picture, in pixels of the screen.
+    // The longer side of the room for the picture, in pixels of the screen.
     int pictureSide() const;
 
 Q_SIGNALS:
@@ -48,8 +49,11 @@ protected:
 
 private:
     QRect pictureRoom() const;
+    int nameHeight() const;
+    void fitPicture();
 
     Look m_look;
+    QImage m_fitted; // in pixels of the screen
     QWidget* m_strip;
     QPushButton* m_minus;
     QPushButton* m_copies;

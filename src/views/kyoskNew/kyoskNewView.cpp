@@ -13,7 +13,6 @@
 #include <QApplication>
 #include <QKeyEvent>
 #include <QLineEdit>
-#include <QScreen>
 #include <QStackedLayout>
 
 #include <algorithm>
@@ -82,7 +81,11 @@ QLayout* kyoskNewView::makeTopRow() {
     QPushButton* chosen = button(c.Command14, Role::Plain, &kyoskNew::Command14_Click, u"check-circle"_s);
     m_previous = button(c.Image15, Role::Plain, &kyoskNew::Image15_Click);
     m_next = button(c.Image16, Role::Plain, &kyoskNew::Image16_Click);
-    return inRow(Space::Small, {{inColumn(Space::None, {title, m_folder}), 1}, chosen, m_previous, m_next});
+    // The arrows stay where they are from page to page.
+    QLabel* range = centred(lineLabel(c.pageRange, "strong"));
+    range->setMinimumWidth(theme().px(130));
+    keepPlaceWhenHidden(*range);
+    return inRow(Space::Small, {{inColumn(Space::None, {title, m_folder}), 1}, chosen, m_previous, range, m_next});
 }
 
 QWidget* kyoskNewView::makeGrid() {
@@ -318,10 +321,9 @@ void kyoskNewView::keyPressEvent(QKeyEvent* event) {
 void kyoskNewView::fitCells() {
     if (isDetached() || !isVisible())
         return;
-    m_page.setScreenHeight(screen()->size().height());
     // A cell that was never shown has no true size yet.
     if (m_cells[0]->isVisible())
-        m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()));
+        m_page.setCellPixels(std::max(40, m_cells[0]->pictureSide()), m_large->longerSide());
 }
 
 void kyoskNewView::renderCells() {
@@ -368,9 +370,11 @@ void kyoskNewView::takeFocus() {
 
 void kyoskNewView::renderFolder() {
     const QString folder = c.Label29.text.trimmed();
+    const QString leaf = DrivePath(folder).leaf();
+    const QString name = leaf.isEmpty() ? folder : leaf; // as in the picker, whose places customers know
     QString line;
     if (!folder.isEmpty())
-        line = fromLeft(m_folder->fontMetrics().elidedText(folder, Qt::ElideMiddle, theme().size(Extent::WideField))) +
+        line = fromLeft(m_folder->fontMetrics().elidedText(name, Qt::ElideMiddle, theme().size(Extent::WideField))) +
                u"  ·  "_s + c.pictureCount.text;
     m_folder->setText(line);
 }
