@@ -15,6 +15,10 @@ struct CardWords {
 };
 
 CardWords cardWords(const Cards::Card& card, QDate today, bool english);
+// "SD card"; of a medium that is not known its label, where it has one.
+QString mediumWords(const Medium& medium, bool english);
+// Where there are several of one name.
+QString withLabel(const QString& words, const QString& label);
 // How far the copying of what was chosen from cards has come.
 struct CopyCount {
     qsizetype kept = 0;

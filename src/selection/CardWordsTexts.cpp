@@ -8,20 +8,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-QString headOf(const Medium& medium, bool english) {
-    switch (medium.kind) {
-    case Medium::Kind::SdCard:
-        return english ? u"SD card"_s : u"כרטיס SD"_s;
-    case Medium::Kind::Card:
-        return english ? u"Memory card"_s : u"כרטיס זיכרון"_s;
-    case Medium::Kind::Stick:
-        return english ? u"USB stick"_s : u"התקן USB"_s;
-    case Medium::Kind::Other:
-        break;
-    }
-    return !medium.label.isEmpty() ? medium.label : english ? u"Card or stick"_s : u"כרטיס או התקן USB"_s;
-}
-
 QString countOf(const CardSummary& card, bool english) {
     if (card.pictures == 1 && !card.more)
         return english ? u"1 picture"_s : u"תמונה אחת"_s;
@@ -41,8 +27,26 @@ QString newestOf(QDate day, QDate today, bool english) {
 
 } // namespace
 
+QString mediumWords(const Medium& medium, bool english) {
+    switch (medium.kind) {
+    case Medium::Kind::SdCard:
+        return english ? u"SD card"_s : u"כרטיס SD"_s;
+    case Medium::Kind::Card:
+        return english ? u"Memory card"_s : u"כרטיס זיכרון"_s;
+    case Medium::Kind::Stick:
+        return english ? u"USB stick"_s : u"התקן USB"_s;
+    case Medium::Kind::Other:
+        break;
+    }
+    return !medium.label.isEmpty() ? medium.label : english ? u"Card or stick"_s : u"כרטיס או התקן USB"_s;
+}
+
+QString withLabel(const QString& words, const QString& label) {
+    return label.isEmpty() || label == words ? words : words + u" · \u2068"_s + label + QChar(0x2069);
+}
+
 CardWords cardWords(const Cards::Card& card, QDate today, bool english) {
-    CardWords words{headOf(card.medium, english), {}, false};
+    CardWords words{mediumWords(card.medium, english), {}, false};
     if (!card.summary)
         words.note = english ? u"counting the pictures…"_s : u"סופר את התמונות…"_s;
     else if (!card.summary->readable)

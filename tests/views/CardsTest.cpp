@@ -7,6 +7,7 @@
 #include "selection/pictures/kyoskNew.h"
 #include "session/SessionState.h"
 #include "support/TestPlatform.h"
+#include "views/kit/ElidedLabel.h"
 #include "views/window/PicturePicker.h"
 
 #include <QDateTime>
@@ -123,16 +124,21 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
               u"Today · Saturday, 21 November 2026|c.HEIC|Yesterday · Friday, 20 November 2026|a.jpg|b.jpg|"
               "Thursday, 19 November 2026|old.jpg");
     EXPECT_EQ(grid->currentRow(), 1);
+    const auto* card = picker.findChild<QAbstractButton*>(u"place(0)"_s);
+    EXPECT_EQ(card->accessibleName(), u"Card or stick"_s);
+    EXPECT_EQ(picker.findChild<ElidedLabel*>()->accessibleName(),
+              u"Card or stick \u203A \u2068DCIM\u2069 \u203A \u2068101CANON\u2069"_s);
     for (const char* name : {"LATER", "LAST"})
         std::filesystem::create_directories(media / name);
     const auto* third = picker.findChild<QAbstractButton*>(u"card(2)"_s);
     const auto places = [&] {
         QStringList folders;
         for (const auto* place : picker.findChildren<QAbstractButton*>(QRegularExpression(u"^place"_s)))
-            folders += place->toolTip();
+            folders += place->property("folder").toString();
         return folders.filter(toText(media));
     };
     EXPECT_TRUE(QTest::qWaitFor([&] { return places().size() == 3 && !third->isHidden(); }, 20000));
+    EXPECT_EQ(card->accessibleName(), u"Card or stick · \u2068EOS\u2069"_s);
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, CardsLook, PageLook::screens(), PageLook::nameOf);

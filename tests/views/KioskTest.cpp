@@ -74,7 +74,7 @@ TEST_F(KioskWindow, PicksFromCardsAndSticksAlone) {
                                    Dialogs::Offer::Pictures);
         QStringList names;
         for (const auto* place : picker.findChildren<QAbstractButton*>(QRegularExpression(u"^place"_s)))
-            names += place->toolTip();
+            names += place->property("folder").toString();
         EXPECT_TRUE(staffIsThere || !picker.findChild<QAbstractButton*>(u"pickerUp"_s)->isEnabled());
         for (int row = 0; const auto* item = picker.findChild<QListWidget*>(u"pickerGrid"_s)->item(row); ++row)
             names += item->text();

@@ -24,7 +24,7 @@ void ElidedLabel::resizeEvent(QResizeEvent* event) {
 }
 
 void ElidedLabel::elide() {
-    setText(fromLeft(fontMetrics().elidedText(m_whole, Qt::ElideLeft, contentsRect().width())));
+    setText(atLineStart(fontMetrics().elidedText(m_whole, Qt::ElideLeft, contentsRect().width()), !isRightToLeft()));
 }
 
 } // namespace lumora

@@ -21,6 +21,7 @@
 #include <QStyledItemDelegate>
 
 #include <algorithm>
+#include <cstdlib>
 
 namespace lumora {
 
@@ -46,11 +47,11 @@ public:
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override {
         painter->save();
+        painter->setLayoutDirection(option.widget->parentWidget()->layoutDirection());
         if (index.data(HeadingRole).toBool()) {
             const int inset = m_theme.size(Space::Small);
             painter->setFont(m_theme.font(Theme::Type::Strong));
             painter->setPen(Theme::Colour::Ink);
-            painter->setLayoutDirection(option.direction);
             painter->drawText(option.rect.adjusted(inset, 0, -inset, -m_theme.size(Space::Tight)),
                               Qt::AlignBottom | Qt::AlignLeft, index.data(Qt::DisplayRole).toString());
             painter->restore();
@@ -125,8 +126,22 @@ protected:
     }
 };
 
-QString nameOf(const HostPath& path) {
+QString leafOf(const HostPath& path) {
     return toText(path.filename());
+}
+
+// A text without the room for one line has two, broken at the blank nearest to its middle. Each stands off from a sign.
+QString inLines(QString text, const QFontMetrics& metrics, int room) {
+    const auto away = [&](qsizetype at) { return std::abs(2 * at - text.size()); };
+    qsizetype blank = -1;
+    for (qsizetype at = text.indexOf(u' '); at >= 0; at = text.indexOf(u' ', at + 1))
+        blank = blank < 0 || away(at) < away(blank) ? at : blank;
+    if (blank >= 0 && metrics.horizontalAdvance(text) > room)
+        text[blank] = u'\n';
+    QStringList lines = text.split(u'\n');
+    for (QString& line : lines)
+        line = QChar(0xA0) + metrics.elidedText(line, Qt::ElideRight, room);
+    return lines.join(u'\n');
 }
 
 // The picker opens at the first place that holds anything, not at the last folder: that may be another customer's.
@@ -195,18 +210,16 @@ QLayout* PicturePicker::makePlaces() {
     m_side->addStretch(1);
     for (std::size_t i = 0; i < m_places.size(); ++i)
         addPlaceButton(i);
+    showPlaceNames();
     return m_side;
 }
 
 void PicturePicker::addPlaceButton(std::size_t i) {
     const Place& place = m_places[i];
     QPushButton* button =
-        wordButton(u"place(%1)"_s.arg(i), "plain", place.name, [this, i] { open(startOf(m_places[i].folder)); });
+        wordButton(u"place(%1)"_s.arg(i), "tall", place.words, [this, i] { open(startOf(m_places[i].folder)); });
     setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
-    const int room = m_theme.size(Extent::Field);
-    button->setText(QChar(0xA0) +
-                    button->fontMetrics().elidedText(place.name, Qt::ElideMiddle, room).replace(u'&', u"&&"_s));
-    button->setToolTip(toText(place.folder));
+    button->setProperty("folder", toText(place.folder));
     button->setCheckable(true);
     button->setFixedWidth(m_theme.size(Extent::WideField));
     m_placeButtons.push_back(button);
@@ -215,14 +228,67 @@ void PicturePicker::addPlaceButton(std::size_t i) {
 
 // A card that came later is added below the others, so that no place moves below a finger.
 void PicturePicker::joinPlaces(const std::vector<Cards::Card>& cards) {
+    for (Place& place : m_places) {
+        if (!place.label.isEmpty()) // its kind may be known by now
+            place = placeOf(place.folder);
+    }
     for (const Cards::Card& card : cards) {
         const HostPath& folder = card.medium.folder;
         const auto isIt = [&](const Place& place) { return place.folder == folder; };
         if (!card.summary || !isOpenTo(folder) || std::any_of(m_places.begin(), m_places.end(), isIt))
             continue;
-        m_places.push_back({toText(folder.filename()), u"card"_s, folder});
+        m_places.push_back(placeOf(folder));
         addPlaceButton(m_places.size() - 1);
     }
+    showPlaceNames();
+    m_where->setWhole(wordsOf(m_folder));
+}
+
+PicturePicker::Place PicturePicker::placeOf(const HostPath& medium) const {
+    Medium known;
+    known.label = toText(medium.filename());
+    for (const Cards::Card& card : m_cards.all()) {
+        if (card.medium.folder == medium)
+            known.kind = card.medium.kind;
+    }
+    return {mediumWords({{}, known.kind, {}, {}}, m_state.english()), u"card"_s, medium, known.label};
+}
+
+// Two of a kind are told apart by what their owner or their camera has named them.
+QString PicturePicker::nameOf(const Place& place) const {
+    const auto isOfItsKind = [&](const Place& other) { return other.words == place.words; };
+    return std::count_if(m_places.begin(), m_places.end(), isOfItsKind) > 1 ? withLabel(place.words, place.label)
+                                                                            : place.words;
+}
+
+void PicturePicker::showPlaceNames() {
+    for (std::size_t i = 0; i < m_placeButtons.size(); ++i) {
+        QPushButton* button = m_placeButtons[i];
+        const QString name = nameOf(m_places[i]);
+        button->ensurePolished();
+        const int room = m_theme.size(Extent::WideField) - m_theme.px(56); // beside its sign
+        button->setText(inLines(name, button->fontMetrics(), room).replace(u'&', u"&&"_s));
+        button->setAccessibleName(name);
+    }
+}
+
+// The place that is nearest above, and the folders below it.
+QString PicturePicker::wordsOf(const HostPath& folder) const {
+    const Place* nearest = nullptr;
+    const auto isIn = [&](const HostPath& place) {
+        return std::mismatch(place.begin(), place.end(), folder.begin(), folder.end()).first == place.end();
+    };
+    for (const Place& place : m_places) {
+        if (isIn(place.folder) && (!nearest || place.folder.native().size() > nearest->folder.native().size()))
+            nearest = &place;
+    }
+    if (!nearest)
+        return toText(folder);
+    QString words = nameOf(*nearest);
+    for (auto at = std::mismatch(nearest->folder.begin(), nearest->folder.end(), folder.begin(), folder.end()).second;
+         at != folder.end(); ++at)
+        words += u" \u203A \u2068"_s + toText(*at) + QChar(0x2069);
+    return words;
 }
 
 QPushButton* PicturePicker::wordButton(const QString& name, const char* role, const QString& text,
@@ -247,6 +313,8 @@ void PicturePicker::makeGrid() {
     m_grid->setUniformItemSizes(!watchesCards()); // a heading takes a row
     m_grid->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     m_grid->setProperty("ownRing", true);
+    // As the small pictures of the page run.
+    m_grid->setLayoutDirection(Qt::LeftToRight);
     connect(m_grid, &QListWidget::itemDoubleClicked, this, &PicturePicker::activate);
     connect(m_grid, &QListWidget::itemActivated, this, &PicturePicker::activate);
     connect(m_grid, &QListWidget::itemClicked, this, [this](const QListWidgetItem* item) {
@@ -259,6 +327,7 @@ void PicturePicker::makeGrid() {
     });
     m_empty = centred(words("muted"));
     m_empty->setAttribute(Qt::WA_TransparentForMouseEvents);
+    m_empty->setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     m_grid->setLayout(inColumn(Space::None, {m_empty}));
 }
 
@@ -335,10 +404,13 @@ void PicturePicker::showCards() {
         slot.tile->setSize(many ? CardOffer::Size::Slim : CardOffer::Size::Large);
         slot.tile->setVisible(in || &slot == &m_cardSlots.front());
         slot.tile->setEnabled(words.opens);
-        slot.tile->setText(words.head);
+        const bool isOneOfSeveral = std::count_if(cards.begin(), cards.end(), [&](const Cards::Card& other) {
+                                        return mediumWords(other.medium, m_state.english()) == words.head;
+                                    }) > 1;
+        const QString head = in && isOneOfSeveral ? withLabel(words.head, card->medium.label) : words.head;
+        slot.tile->setText(head);
         slot.tile->setNote(words.note);
-        slot.tile->setToolTip(in ? card->medium.label : QString());
-        slot.tile->setAccessibleName(words.note.isEmpty() ? words.head : words.head + u", "_s + words.note);
+        slot.tile->setAccessibleName(words.note.isEmpty() ? head : head + u", "_s + words.note);
     }
     if (m_side)
         joinPlaces(cards);
@@ -351,16 +423,23 @@ void PicturePicker::openCard(std::size_t slot) {
 
 std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initialFolder) const {
     std::vector<Place> result;
-    const auto add = [&](const QString& name, const QString& icon, const HostPath& folder) {
+    const auto addPlace = [&](const Place& place) {
         std::error_code error;
         const bool known =
-            std::any_of(result.begin(), result.end(), [&](const Place& place) { return place.folder == folder; });
-        if (!folder.empty() && !known && std::filesystem::is_directory(folder, error))
-            result.push_back({name, icon, folder});
+            std::any_of(result.begin(), result.end(), [&](const Place& other) { return other.folder == place.folder; });
+        if (!place.folder.empty() && !known && std::filesystem::is_directory(place.folder, error))
+            result.push_back(place);
     };
+    const auto add = [&](const QString& words, const QString& icon, const HostPath& folder) {
+        addPlace({words, icon, folder});
+    };
+    const QString ofProgram = m_state.wording(u"תיקיית התוכנה"_s, u"The program's folder"_s);
     const auto addDrive = [&](const Drives::Drive& drive) {
-        const QString name = drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : drive.name;
-        add(name, drive.removable ? u"card"_s : u"drive"_s, drive.folder);
+        if (drive.removable)
+            addPlace(placeOf(drive.folder));
+        else
+            add(drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : ofProgram, u"drive"_s,
+                drive.folder);
     };
     if (m_state.closedToCustomers()) {
         const CustomersMedia media(m_files.drives());
@@ -376,17 +455,18 @@ std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initial
     const auto standard = [](QStandardPaths::StandardLocation where) {
         return toHostPath(QStandardPaths::writableLocation(where));
     };
-    add(m_state.wording(u"תמונות"_s, u"Pictures"_s), u"pictures"_s, standard(QStandardPaths::PicturesLocation));
+    add(m_state.wording(u"התמונות במחשב זה"_s, u"This computer's pictures"_s), u"pictures"_s,
+        standard(QStandardPaths::PicturesLocation));
     add(m_state.wording(u"שולחן העבודה"_s, u"Desktop"_s), u"picture"_s, standard(QStandardPaths::DesktopLocation));
     add(m_state.wording(u"הורדות"_s, u"Downloads"_s), u"folder"_s, standard(QStandardPaths::DownloadLocation));
     add(m_state.wording(u"תיקיית הבית"_s, u"Home folder"_s), u"home"_s, standard(QStandardPaths::HomeLocation));
     if (const auto initial = m_files.drives().toHost(initialFolder))
-        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : initialFolder.text().left(2),
+        add(everyFile() ? m_state.wording(u"התיקייה הנוכחית"_s, u"This folder"_s) : ofProgram,
             everyFile() ? u"folder"_s : u"drive"_s, *initial);
     for (const Drives::Drive& drive : drives)
         addDrive(drive);
     if (result.empty())
-        result.push_back({u"/"_s, u"drive"_s, "/"});
+        add(m_state.wording(u"כל המחשב"_s, u"This computer"_s), u"drive"_s, "/");
     return result;
 }
 
@@ -403,7 +483,7 @@ void PicturePicker::open(const HostPath& folder) {
         if (m_places[i].folder == folder)
             m_placeButtons[i]->setChecked(true);
     }
-    m_where->setWhole(toText(folder));
+    m_where->setWhole(wordsOf(folder));
 
     std::vector<HostPath> folders;
     std::vector<HostPath> files;
@@ -414,7 +494,7 @@ void PicturePicker::open(const HostPath& folder) {
     for (; !error && at != std::filesystem::directory_iterator(); at.increment(error)) {
         const HostPath& path = at->path();
         std::error_code kind;
-        if (nameOf(path).startsWith(u'.') || (at->is_symlink(kind) && !isOpenTo(path)))
+        if (leafOf(path).startsWith(u'.') || (at->is_symlink(kind) && !isOpenTo(path)))
             continue;
         if (at->is_directory(kind))
             folders.push_back(path);
@@ -422,7 +502,7 @@ void PicturePicker::open(const HostPath& folder) {
             files.push_back(path);
     }
     const auto byName = [](const HostPath& a, const HostPath& b) {
-        return nameOf(a).compare(nameOf(b), Qt::CaseInsensitive) < 0;
+        return leafOf(a).compare(leafOf(b), Qt::CaseInsensitive) < 0;
     };
     std::sort(folders.begin(), folders.end(), byName);
     std::sort(files.begin(), files.end(), byName);
@@ -449,14 +529,14 @@ void PicturePicker::open(const HostPath& folder) {
 }
 
 bool PicturePicker::isPicture(const HostPath& path) const {
-    return isPictureFile(nameOf(path), m_state.door.everyFormat);
+    return isPictureFile(leafOf(path), m_state.door.everyFormat);
 }
 
 void PicturePicker::addPicture(const HostPath& path, bool isFolder) {
-    auto* item = new QListWidgetItem(nameOf(path), m_grid);
+    auto* item = new QListWidgetItem(leafOf(path), m_grid);
     item->setData(PathRole, QByteArray::fromStdString(path.string()));
     item->setData(FolderRole, isFolder);
-    item->setToolTip(nameOf(path));
+    item->setToolTip(leafOf(path));
     item->setData(PlainRole, !isFolder && !isPicture(path));
     if (!isFolder && isPicture(path))
         m_unread.push_back(m_grid->row(item));

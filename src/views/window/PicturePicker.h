@@ -40,9 +40,10 @@ Q_SIGNALS:
 
 private:
     struct Place {
-        QString name;
+        QString words; // as customers say it
         QString icon;
         HostPath folder;
+        QString label = {}; // of a medium; tells it from another of its kind
     };
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
     std::vector<Place> places(const DrivePath& initialFolder) const;
@@ -59,6 +60,10 @@ private:
     void addByDays(const std::vector<HostPath>& files);
     QLayout* makePlaces();
     void addPlaceButton(std::size_t place);
+    Place placeOf(const HostPath& medium) const;
+    QString nameOf(const Place& place) const;
+    void showPlaceNames();
+    QString wordsOf(const HostPath& folder) const;
     void joinPlaces(const std::vector<Cards::Card>& cards);
     void makeGrid();
     QPushButton* wordButton(const QString& name, const char* role, const QString& text,
