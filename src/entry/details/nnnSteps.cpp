@@ -1,6 +1,7 @@
 #include "entry/details/nnn.h"
 
 #include "common/FixedText.h"
+#include "common/PaperSize.h"
 #include "entry/details/TileMenu.h"
 #include "session/SessionState.h"
 
@@ -107,6 +108,9 @@ void nnn::showStep() {
     LabelText4.visible = Text4.visible = m_step == Step::Details && m_state.MishloachHabaita;
     for (std::size_t i = 0; i < Option1.size(); ++i) {
         Option1[i].text = m_quickSizes[i];
+        Option1[i].hint = PaperSize::ofText(m_quickSizes[i])
+                              ? m_state.wording(u"%1 ס\"מ", u"%1 cm").arg(m_quickSizes[i].trimmed())
+                              : m_quickSizes[i];
         Option1[i].visible = options && !m_quickSizes[i].isEmpty();
     }
     Command8.visible = options && (Option3[0].checked || Option3[1].checked);

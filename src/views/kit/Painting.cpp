@@ -153,20 +153,4 @@ void drawBorderSample(QPainter& painter, const QRectF& room, const QString& code
     painter.restore();
 }
 
-void drawPaperSample(QPainter& painter, const QRectF& room, QSizeF size) {
-    if (size.isEmpty())
-        size = {1, 1};
-    if (size.width() < size.height())
-        size.transpose();
-    // The largest that the lab cuts is 50 by 70; a small one keeps a size that can be seen.
-    const double share = std::clamp(0.62 + 0.38 * (size.width() - 10) / 30.0, 0.62, 1.0);
-    const QRectF box = fitted(room, size, share);
-    painter.setPen(Qt::NoPen);
-    painter.setBrush(QColor(0, 0, 0, 28));
-    painter.drawRect(box.translated(3, 3));
-    painter.fillRect(box, Qt::white);
-    drawSamplePicture(painter, box);
-    drawThinLine(painter, box);
-}
-
 } // namespace lumora

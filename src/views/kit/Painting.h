@@ -32,9 +32,6 @@ enum class PaperFinish { Glossy, Matte, Silk };
 void drawSamplePrint(QPainter& painter, const QRectF& paper, PaperFinish finish);
 // The same with the border of this code around it.
 void drawBorderSample(QPainter& painter, const QRectF& room, const QString& code);
-// The same as paper of that size in centimetres, in landscape; a size without sides gives a square. All sizes are drawn
-// at one scale.
-void drawPaperSample(QPainter& painter, const QRectF& room, QSizeF size);
 void drawThinLine(QPainter& painter, const QRectF& box);
 
 // A text that was set apart for a line of the other direction, without the signs that do it.

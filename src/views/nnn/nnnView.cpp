@@ -4,6 +4,7 @@
 #include "entry/details/TileMenu.h"
 #include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
+#include "views/nnn/PaperBesideHand.h"
 #include "views/nnn/nnnViewAlbum.h"
 
 #include <QCheckBox>
@@ -16,6 +17,16 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+// A text that is no size is drawn as a square.
+QSizeF lyingPaper(const QString& text) {
+    const PaperSize sides = PaperSize::ofText(text.trimmed()).value_or(PaperSize{10, 10});
+    return QSizeF(std::max(sides.shortSide, sides.longSide), std::min(sides.shortSide, sides.longSide));
+}
+
+} // namespace
 
 nnnView::nnnView(nnn& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme) {
@@ -101,11 +112,14 @@ QWidget* nnnView::makeDetails() {
 QWidget* nnnView::makeOptions() {
     auto* sizes = inRow(Space::Wide);
     for (std::size_t i = 0; i < c.Option1.size(); ++i) {
-        const auto paper = [](QPainter& painter, const QRectF& place, const QString& size) {
-            const PaperSize sides = PaperSize::ofText(withoutIsolation(size)).value_or(PaperSize());
-            drawPaperSample(painter, place, QSizeF(sides.shortSide, sides.longSide));
+        const auto paper = [this, i](QPainter& painter, const QRectF& place, const QString&) {
+            QSizeF largest;
+            for (const CheckCaption& size : c.Option1)
+                largest = size.visible ? largest.expandedTo(lyingPaper(size.text)) : largest;
+            drawPaperBesideHand(painter, place, lyingPaper(c.Option1[i].text), largest);
         };
         auto* card = new DrawingCard(theme(), this, paper, {190, 200}, DrawingCard::Words::Size);
+        m_sizes[i] = card;
         bindChoice(card, c.Option1[i], [this, i] { m_page.Option1_Click(static_cast<int>(i)); });
         sizes->addWidget(card, 2);
     }
@@ -264,6 +278,13 @@ void nnnView::render() {
         m_tiles[i]->setMarked(c.markedTile == static_cast<int>(i));
     }
     placeTiles();
+    for (std::size_t i = 0; i < m_sizes.size(); ++i) {
+        // The card draws its words from left to right.
+        m_sizes[i]->setText(state().english() ? c.Option1[i].hint
+                                              : QChar(0x2067) + isolated(c.Option1[i].hint) + QChar(0x2069));
+        m_sizes[i]->setToolTip({});
+        speak(m_sizes[i], c.Option1[i].hint);
+    }
     speak(m_name, c.LabelText2.text);
     speak(m_telephone, c.LabelText3.text);
     speak(m_address, c.LabelText4.text);

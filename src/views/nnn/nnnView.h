@@ -41,6 +41,7 @@ private:
     std::unique_ptr<Album> m_album;
     QStackedLayout* m_steps;
     std::array<Tile*, 10> m_tiles{};
+    std::array<QAbstractButton*, 3> m_sizes{};
     QGridLayout* m_tileGrid = nullptr;
     QList<int> m_placed;
     QLineEdit* m_name = nullptr;
