@@ -123,7 +123,7 @@ class Walk:
                 kept = here if here.is_dir() else kept
                 folder = None
             elif page == 'nnn':
-                order.details.update(shown)
+                order.details.update({key: text.rstrip() for key, text in shown.items()})  # as the order trims what is typed
                 order.left = line['act']
                 if 'Text2' in shown:  # the address is asked for only where it is wanted
                     order.details['Text4'] = shown.get('Text4', '')
@@ -243,7 +243,7 @@ class Walk:
             same('the special extras', [field(f'Tosafot2_{i}')[-2:] for i in range(1, 7)], [row[-2:] for row in bill if re.search('=[01]$', row)])
         else:
             name, telephone = details.get('Text2', field('n1')), details.get('Text3', field('n2'))
-            same('the name', field('n1'), name.rstrip())
+            same('the name', field('n1'), name)
             same('the telephone', field('n2'), telephone)
             same('the delivery address', field('n3'), details.get('Text4', field('n3')).strip())
             same('the notes', field('Hearot').rpartition(' - ')[0], closing.get('Text2', ''))
