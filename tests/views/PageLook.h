@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <ostream>
+#include <vector>
 
 namespace lumora {
 
@@ -20,12 +21,19 @@ inline void PrintTo(const Screen& screen, std::ostream* out) {
 }
 
 // Each page in each state, in both languages, on a small, a wide and a tall screen: looked at for what a person could
-// stumble over, and photographed where LUMORA_SHOTS asks for it.
+// stumble over, and photographed where LUMORA_SHOTS asks for it. LUMORA_SCREENS=all brings the smallest and the largest
+// screen, and each in both languages.
 class PageLook : public ::testing::TestWithParam<Screen> {
 public:
     static auto screens() {
-        return ::testing::Values(Screen{{1024, 768}, false}, Screen{{1024, 768}, true}, Screen{{1920, 1080}, false},
-                                 Screen{{1080, 1920}, true});
+        std::vector<Screen> all = {
+            {{1024, 768}, false}, {{1024, 768}, true}, {{1920, 1080}, false}, {{1080, 1920}, true}};
+        if (qEnvironmentVariable("LUMORA_SCREENS") == u"all") {
+            all.insert(all.end(), {{{1920, 1080}, true}, {{1080, 1920}, false}});
+            for (const QSize& size : {QSize(800, 600), QSize(3840, 2160)})
+                all.insert(all.end(), {{size, false}, {size, true}});
+        }
+        return ::testing::ValuesIn(all);
     }
     static std::string nameOf(const ::testing::TestParamInfo<Screen>& info) {
         const QSize size = info.param.size;
