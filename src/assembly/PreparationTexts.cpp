@@ -29,7 +29,7 @@ QString PreparationPage::totalText() const {
 void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
     switch (what) {
     case NotWritten::Folder:
-        return tell(u"לא ניתן ליצור את תיקיית ההזמנה. פנה מקום בדיסק או תקן את ההרשאות ונסה שוב."_s,
+        return tell(u"לא ניתן ליצור את תיקיית ההזמנה. יש לפנות מקום בדיסק או לתקן את ההרשאות ולנסות שוב."_s,
                     u"The order's folder can't be made. Free some space or mend the rights, then try again."_s,
                     failure.message);
     case NotWritten::File:
@@ -37,12 +37,12 @@ void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
                     u"A file of the order could not be written. What was prepared so far is kept."_s, failure.message);
     case NotWritten::Print:
         return tell(u"תמונה שהכנתה נכשלה נשארה בתיקיית ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. "
-                    u"תקן ונסה שוב."_s,
+                    u"יש לתקן ולנסות שוב."_s,
                     u"A print that failed can't be removed from the order, so the order was not sent. What was "
                     u"prepared is kept. Put it right, then try again."_s,
                     failure.message);
     case NotWritten::Sheet:
-        return tell(u"לא ניתן לכתוב את דף ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
+        return tell(u"לא ניתן לכתוב את דף ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. יש לתקן ולנסות שוב."_s,
                     u"The order sheet can't be written, so the order was not sent. What was prepared is kept. "
                     u"Put it right, then try again."_s,
                     failure.message);
@@ -50,7 +50,7 @@ void PreparationPage::notWritten(NotWritten what, const Failure& failure) {
         return tell(u"מספר ההזמנה הבאה לא נשמר. ההזמנה ממשיכה כרגיל."_s,
                     u"The number of the next order could not be stored. This order goes on."_s, failure.message);
     case NotWritten::Log:
-        return tell(u"לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. תקן ונסה שוב."_s,
+        return tell(u"לא ניתן לכתוב את פרטי ההזמנה, ולכן ההזמנה לא נשלחה. התמונות שהוכנו נשמרו. יש לתקן ולנסות שוב."_s,
                     u"The order's details can't be written, so the order was not sent. What was prepared is kept. "
                     u"Put it right, then try again."_s,
                     failure.message);

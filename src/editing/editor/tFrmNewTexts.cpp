@@ -64,7 +64,7 @@ void tFrmNew::setTexts() {
             {Command23, u"15/21"},
             {Frame3, u"גוונים", u"Tones"},
             {Frame4, u"סיבוב", u"Turn"},
-            {Image19, u"בחר תמונה בדף התמונות", u"Choose a picture on the page of pictures"},
+            {Image19, u"יש לבחור תמונה בדף התמונות", u"Choose a picture on the page of pictures"},
             {placeTitle, u"גודל ומקום", u"Size and place"},
             {turnTitle, u"סיבוב", u"Turn"},
             {lightTitle, u"אור וצבע", u"Light and colour"},
@@ -81,7 +81,7 @@ void tFrmNew::setTexts() {
                              {words.lineStyles, u"Line style"},
                              {words.emptyCell, u"תא ריק", u"Empty place"},
                              {words.openCell, u"%1, פתוחה לעריכה", u"%1, open for editing"},
-                             {words.otherCell, u"%1, לחץ לעריכה", u"%1, press to edit"},
+                             {words.otherCell, u"%1, לחיצה פותחת לעריכה", u"%1, press to edit"},
                          });
     // The hint of a button that goes on as long as it is held says so.
     for (Caption* held : {&Image2[0], &Image2[1], &Image2[3], &Image2[4], &Image135, &Image115, &Image125, &Image145,

@@ -84,12 +84,12 @@ void RedI::setTexts() {
         });
     setWordings(m_state,
                 {
-                    {words.steps[0], u"הקש על העין", u"Tap the red eye"},
-                    {words.steps[1], u"התאם את העיגול", u"Fit the circle"},
-                    {words.steps[2], u"לחץ על תיקון", u"Press Correct"},
-                    {words.steps[3], u"אשר את התמונה", u"Accept"},
+                    {words.steps[0], u"הקשה על העין", u"Tap the red eye"},
+                    {words.steps[1], u"התאמת העיגול", u"Fit the circle"},
+                    {words.steps[2], u"לחיצה על תיקון", u"Press Correct"},
+                    {words.steps[3], u"אישור התמונה", u"Accept"},
                     {words.picture, u"התמונה: %1", u"The picture: %1"},
-                    {words.overview, u"התמונה כולה, הקש על העין האדומה", u"The whole picture: tap the red eye"},
+                    {words.overview, u"התמונה כולה: יש להקיש על העין האדומה", u"The whole picture: tap the red eye"},
                 });
     Label40.visible = m_step != Step::Corrected;
     Label41.visible = m_step == Step::Aim;

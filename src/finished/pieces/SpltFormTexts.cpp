@@ -25,7 +25,7 @@ void SpltForm::setTexts() {
             {Label4Famely, u"חלקי המשפחה שנבחרה", u"Pieces of the chosen family"},
             {Label4Chalakim, u"כל הקבצים שנקראו", u"All the files read"},
             {Label4Text2, u"גודל חלק, בבתים", u"Size of a piece, in bytes"},
-            {Label4Idle, u"בחרו תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים.",
+            {Label4Idle, u"יש לבחור תיקייה לחיתוך, או תיקייה של חלקים לצירוף. הקבצים עצמם אינם משתנים.",
              u"Choose a folder to cut, or a folder of pieces to join. The files themselves never change."},
             {Command1, u"MergeAll", u"MergeAll", u"מצרף את כל המשפחות השלמות", u"Joins all the complete families"},
             {Command2, u"בחר תיקייה לחיתוך", u"Choose a folder to cut"},

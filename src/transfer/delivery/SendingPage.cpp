@@ -202,7 +202,7 @@ void SendingPage::tellPhase() {
     m_shown.Label4Title.text = wording(row.title);
     m_shown.Label4Do.text = adviceOf(row);
     m_leftOut.show();
-    m_shown.Label4Order.text = wording(u"ההזמנה שלך", u"Your order");
+    m_shown.Label4Order.text = wording(u"ההזמנה שלכם", u"Your order");
     m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
     m_shown.changeOrder.text = wording(changeWords);
     m_shown.changeOrder.visible = row.buttons.testFlag(SendingButton::Change) && mayChange();

@@ -173,7 +173,7 @@ void FtpFrm::setTexts() {
           u"The order is kept on this computer, and files that have arrived are not sent again."},
          {Label4DiffTitle, u"זמן משוער שנותר לסיום המשלוח", u"Estimated time left to the end of the sending"},
          {Label4Minutes, u"דקות", u"minutes"},
-         {numberPrompt, u"מספר ההזמנה שלך", u"Your order number"},
+         {numberPrompt, u"מספר ההזמנה שלכם", u"Your order number"},
          {PicInProgKatan, u"חלקי ההזמנה", u"Pieces of the order"},
          {Picture7, u"שים לב !!\rהתמונות עדיין לא נשלחו ברשת\rאם תסגור את התוכנה כעת \rיתכן ולא כל התמונות יודפסו",
           u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "

@@ -81,7 +81,7 @@ void StaffPanel::render() {
                                        .wording(u"יותר מדי ניסיונות. אפשר לנסות שוב בעוד %1 שניות.",
                                                 u"Too many tries. You can try again in %1 seconds.")
                                        .arg(seconds)
-                     : m_told.isEmpty() ? m_state.wording(u"הקישו את קוד הצוות", u"Type the code of the staff")
+                     : m_told.isEmpty() ? m_state.wording(u"נא להקיש את קוד הצוות", u"Type the code of the staff")
                                         : m_told);
     m_enter->setEnabled(seconds == 0 && !m_typed.isEmpty());
 }
