@@ -19,6 +19,7 @@ ScrolledPicture::ScrolledPicture(const Theme& theme, QWidget* parent, QSize wind
     setLayoutDirection(Qt::LeftToRight);
     setFrameShape(QFrame::NoFrame);
     setFocusPolicy(Qt::NoFocus);
+    setProperty("ownDrag", true);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     setFixedSize(theme.px(window.width()) + verticalScrollBar()->sizeHint().width(),

@@ -5,7 +5,6 @@
 #include <QKeyEvent>
 #include <QPainter>
 #include <QScrollBar>
-#include <QScroller>
 #include <QStyledItemDelegate>
 
 #include <algorithm>
@@ -108,7 +107,6 @@ FrameThumbs::FrameThumbs(const Theme& theme, std::function<Bitmap(int)> picture,
     setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
     setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     setTabKeyNavigation(false);
-    QScroller::grabGesture(viewport(), QScroller::TouchGesture);
     m_thumb = new Thumb(theme, m_picture, m_worn, this);
     setItemDelegate(m_thumb);
     connect(this, &QListWidget::itemClicked, this, [this](QListWidgetItem* item) { Q_EMIT picked(row(item)); });

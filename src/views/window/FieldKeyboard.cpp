@@ -4,6 +4,7 @@
 #include "session/SessionState.h"
 #include "session/lab/MailDomains.h"
 #include "views/kit/EditableCombo.h"
+#include "views/kit/FingerMoves.h"
 #include "views/kit/LiftedStack.h"
 #include "views/kit/Overlay.h"
 #include "views/kit/TouchKeyboard.h"
@@ -13,7 +14,6 @@
 #include <QLineEdit>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
-#include <QPointingDevice>
 #include <QTextEdit>
 #include <QTimer>
 
@@ -45,11 +45,6 @@ QWidget* fieldOf(QWidget* widget) {
 
 QComboBox* boxOf(const QWidget& field) {
     return qobject_cast<QComboBox*>(field.parentWidget());
-}
-
-bool isTouch(const QMouseEvent& event) {
-    return event.source() != Qt::MouseEventNotSynthesized ||
-           (event.pointingDevice() && event.pointingDevice()->type() == QInputDevice::DeviceType::TouchScreen);
 }
 
 // What stands before the cursor.

@@ -2,9 +2,11 @@
 
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "views/kit/FingerMoves.h"
 #include "views/kit/FocusRing.h"
 #include "views/kit/LiftedStack.h"
 #include "views/kit/Overlay.h"
+#include "views/kit/TouchPointer.h"
 #include "views/window/FieldKeyboard.h"
 #include "views/window/PageView.h"
 #include "views/window/PressFilter.h"
@@ -33,6 +35,8 @@ MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     m_stack->setContentsMargins(0, 0, 0, 0);
     setStyleSheet(m_theme->styleSheet());
     new FocusRing(*m_theme, this);
+    new TouchPointer(this);
+    new FingerMoves(this); // behind the other filters, which are asked later then
     connect(&chain, &PageChain::shown, this, &MainWindow::pageShown);
     connect(&chain, &PageChain::unloaded, this, &MainWindow::pageUnloaded);
 }
