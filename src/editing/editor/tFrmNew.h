@@ -7,6 +7,7 @@
 #include "editing/editor/DragHandle.h"
 #include "editing/editor/EditLimits.h"
 #include "editing/editor/LineFrameChoice.h"
+#include "editing/editor/PinchSteps.h"
 #include "editing/editor/SeenFrame.h"
 #include "editing/editor/tFrmNewControls.h"
 #include "editing/redeye/KeptCorrection.h"
@@ -116,6 +117,8 @@ public:
     void PicPic_MouseDown(QPointF at) { beginDrag(at); }
     void PicPic_MouseMove(QPointF at) { drag(at); } // hides the panels also where nothing is dragged
     void PicPic_MouseUp() { endDrag(); }
+    // Two fingers or the wheel: steps of Image2(0) and (1), and of Image16 and Image17, drawn and stored once.
+    void PicPic_Pinch(PinchSteps::Steps steps) { pinch(steps); }
     void Labeltext_MouseDown(QPointF at) { beginCaptionDrag(at); }
     void Labeltext_MouseMove(QPointF at) { dragCaption(at); }
     void Labeltext_MouseUp() { endCaptionDrag(); }
@@ -157,8 +160,9 @@ public:
 
     const tFrmNewControls& controls() const override { return *this; }
     bool pictureOpen() const { return m_open; }
-    int turnDegrees() const;    // clockwise from upright, -179 to 180
-    int frameOnPicture() const; // its row in Combo2List, -1 for none of them
+    int previewZoom() const { return PreviewZoom; } // per cent
+    int turnDegrees() const;                        // clockwise from upright, -179 to 180
+    int frameOnPicture() const;                     // its row in Combo2List, -1 for none of them
     // A small picture of a frame of Combo2List, its longer side 160 pixels; null when there is none.
     Bitmap framePicture(int index) const;
     // What a button does in one line, for customers who can't hover.
@@ -201,6 +205,7 @@ private:
     void endHold(HeldButton::End how = HeldButton::End::LetGo);
     void zoomReleased(HeldButton::End how);
     void zoom();
+    void takeZoom(int step);
     void brighten();
     void turn();
     void moveAcross();
@@ -212,6 +217,7 @@ private:
     void turnTo(std::int16_t code);
     void turnPicture(std::int16_t code);
     void setBarZoom(int percent);
+    void pinch(PinchSteps::Steps steps);
     void beginDrag(QPointF at);
     void drag(QPointF at);
     void endDrag();

@@ -67,11 +67,15 @@ void tFrmNew::holdTool(int index) {
 void tFrmNew::zoom() {
     if (!m_held.ticks(Timer2))
         return;
-    PreviewZoom = EditStep::zoom(PreviewZoom, m_step);
-    m_coverZoom.forget();
-    m_edit.ZoomPercent = PreviewZoom;
+    takeZoom(m_step);
     RenderPreview();
     showNumbers();
+}
+
+void tFrmNew::takeZoom(int step) {
+    PreviewZoom = EditStep::zoom(PreviewZoom, step);
+    m_coverZoom.forget();
+    m_edit.ZoomPercent = PreviewZoom;
 }
 
 void tFrmNew::zoomReleased(HeldButton::End how) {
@@ -136,6 +140,25 @@ void tFrmNew::turnQuarterRight() {
 
 void tFrmNew::turnQuarterLeft() {
     turnTo(EditStep::quarterLeft(m_edit.RotationCode));
+}
+
+// --- two fingers and the wheel ---
+
+void tFrmNew::pinch(PinchSteps::Steps steps) {
+    const Page* front = m_chain.front();
+    if (!m_open || (front != nullptr && front->id() == PageId::mikledet))
+        return;
+    stopHolds();
+    if (steps.zoom != 0)
+        takeZoom(steps.zoom * PinchSteps::zoomStep);
+    const int side = steps.turn < 0 ? -1 : 1;
+    for (int turned = 0; turned != steps.turn; turned += side) {
+        if (side > 0 || m_edit.RotationCode > PinchSteps::leastTurn)
+            turnPicture(EditStep::turn(m_edit.RotationCode, side));
+    }
+    renderPackStore();
+    showNumbers();
+    Q_EMIT changed();
 }
 
 // --- dragging the picture ---

@@ -2,6 +2,7 @@
 
 #include <QMouseEvent>
 #include <QPainter>
+#include <QWheelEvent>
 
 #include <algorithm>
 
@@ -218,6 +219,32 @@ PaperPlace EditorTable::place(int height, const std::optional<PanelForms>& panel
 
 void EditorTable::resizeEvent(QResizeEvent*) {
     Q_EMIT resized();
+}
+
+// The drag of the first finger closes the panel.
+void EditorTable::touched() {
+    m_turns = isVisible() && m_page.controls().Frame4.visible;
+}
+
+void EditorTable::pinched(const Pinch& pinch) {
+    if (!isVisible())
+        return; // its page may have gone
+    if (!m_steps) {
+        m_steps.emplace(m_page.previewZoom());
+        if (m_turns)
+            m_page.Image15_MouseMove();
+    }
+    const PinchSteps::Steps steps = m_steps->follow(pinch.times(), m_turns ? pinch.degrees() : 0);
+    if (steps.any())
+        m_page.PicPic_Pinch(steps);
+}
+
+void EditorTable::wheelEvent(QWheelEvent* event) {
+    m_wheel += event->angleDelta().y();
+    if (const int notches = m_wheel / QWheelEvent::DefaultDeltasPerStep; notches != 0) {
+        m_wheel -= notches * QWheelEvent::DefaultDeltasPerStep;
+        m_page.PicPic_Pinch({notches * PinchSteps::ofNotch, 0});
+    }
 }
 
 void EditorTable::paintEvent(QPaintEvent*) {

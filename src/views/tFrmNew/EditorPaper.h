@@ -1,6 +1,7 @@
 #pragma once
 
 #include "editing/editor/tFrmNew.h"
+#include "views/kit/FingerMoves.h"
 #include "views/kit/Theme.h"
 #include "views/tFrmNew/PaperPlace.h"
 
@@ -42,8 +43,9 @@ private:
     Drag m_drag = Drag::None;
 };
 
-// What the paper lies on: dark and neutral, so that colours are seen as they are.
-class EditorTable : public QWidget {
+// What the paper lies on: dark and neutral, so that colours are seen as they are. Two fingers and the wheel zoom; the
+// fingers turn as well where the panel of the turns is open.
+class EditorTable : public QWidget, public PinchTarget {
     Q_OBJECT
 public:
     EditorTable(tFrmNew& page, const Theme& theme, QWidget* parent);
@@ -54,6 +56,9 @@ public:
     // Fits the paper into so much of the table's height, beside the panel if there is one. Returns where the panel
     // lies.
     PaperPlace place(int height, const std::optional<PanelForms>& panel);
+    void touched() override;
+    void pinched(const Pinch& pinch) override;
+    void pinchEnded() override { m_steps.reset(); }
 
 Q_SIGNALS:
     void resized();
@@ -61,12 +66,16 @@ Q_SIGNALS:
 protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
 
 private:
     tFrmNew& m_page;
     const Theme& m_theme;
     EditorPaper* m_paper;
     QString m_words;
+    std::optional<PinchSteps> m_steps;
+    bool m_turns = false; // the panel was open when the fingers came
+    int m_wheel = 0;      // what is less than a notch, in eighths of a degree
 };
 
 } // namespace lumora
