@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "views/kit/CardOffer.h"
 #include "views/kit/EditableCombo.h"
+#include "views/kit/FingerMoves.h"
 #include "views/kit/Gauge.h"
 #include "views/kit/KeyRows.h"
 #include "views/kit/Overlay.h"
@@ -94,9 +95,18 @@ QWidget* kyoskNewView::makeGrid() {
         grid->addWidget(makeCell(i), i / columns, i % columns);
     for (int i = 0; i < columns; ++i)
         grid->setColumnStretch(i, 1);
-    QWidget* box = inBox(grid);
+    auto* box = new SwipeBox(grid, [this](Swipe::Way way) { swipe(way); });
     bindName(box, c.Frame1);
     return box;
+}
+
+// A page is drawn over as a leaf of a book in the page's language.
+void kyoskNewView::swipe(Swipe::Way way) {
+    if (way == Swipe::Way::None)
+        return;
+    QPushButton* turn = (way == Swipe::Way::Left) == (layoutDirection() == Qt::LeftToRight) ? m_next : m_previous;
+    if (turn->isVisible())
+        turn->click();
 }
 
 PictureCell* kyoskNewView::makeCell(int i) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "selection/pictures/kyoskNew.h"
+#include "views/kit/Swipe.h"
 #include "views/window/PageView.h"
 
 class QStackedLayout;
@@ -31,6 +32,7 @@ protected:
 private:
     QLayout* makeTopRow();
     QWidget* makeGrid();
+    void swipe(Swipe::Way way);
     PictureCell* makeCell(int i);
     QWidget* makeEmpty();
     QWidget* makeSide();
