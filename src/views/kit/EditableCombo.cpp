@@ -3,6 +3,7 @@
 #include <QEvent>
 #include <QLineEdit>
 #include <QSignalBlocker>
+#include <QStyledItemDelegate>
 #include <QTimer>
 
 namespace lumora {
@@ -11,6 +12,7 @@ EditableCombo::EditableCombo(QWidget* parent, std::function<void(int)> chosen,
                              std::function<void(const QString&)> typed)
     : QComboBox(parent) {
     setEditable(true);
+    styleRows(*this);
     setInsertPolicy(QComboBox::NoInsert);
     setProperty("ownRing", true); // its border shows the focus
     lineEdit()->installEventFilter(this);
@@ -49,6 +51,10 @@ bool EditableCombo::eventFilter(QObject* watched, QEvent* event) {
 void EditableCombo::choosePrompt() {
     if (!m_prompt.isEmpty() && currentText() == m_prompt)
         lineEdit()->selectAll();
+}
+
+void styleRows(QComboBox& box) {
+    box.setItemDelegate(new QStyledItemDelegate(&box));
 }
 
 void setDomainBox(QLineEdit& field, EditableCombo& box) {

@@ -28,6 +28,8 @@ private:
     QString m_prompt; // empty while the box says something else
 };
 
+// The rows of a list that opens are as high as the style sheet says; by itself a box draws them as a menu does.
+void styleRows(QComboBox& box);
 // The box takes the domain of the mail address that begins in the field, behind the "@" between them.
 void setDomainBox(QLineEdit& field, EditableCombo& box);
 // Null where the field has none.

@@ -4,6 +4,7 @@
 #include "platform/files/Files.h"
 #include "views/kit/CardButtons.h"
 #include "views/kit/ChoiceCards.h"
+#include "views/kit/EditableCombo.h"
 #include "views/kit/Keyboard.h"
 
 #include <QAbstractButton>
@@ -252,6 +253,7 @@ QListWidget* PageView::listing(const TextList& rows, Reading reading) {
 QListWidget* PageView::list(const TextList& rows, std::function<void(int)> picked, Reading reading) {
     QListWidget* made = listing(rows, std::move(reading));
     made->setFocusPolicy(Qt::StrongFocus);
+    made->setProperty("picked", true); // its rows are as high as buttons
     const auto taken = [made, picked = std::move(picked)](QListWidgetItem* item) { picked(made->row(item)); };
     connect(made, &QListWidget::itemClicked, this, taken);
     connect(made, &QListWidget::itemActivated, this, taken);
@@ -283,6 +285,7 @@ QCheckBox* PageView::checkBox(const CheckCaption& caption, std::function<void(bo
 
 QComboBox* PageView::comboBox(const TextList& list, const Caption& caption, std::function<void(int)> activated) {
     auto* made = new QComboBox(this);
+    styleRows(*made);
     made->setProperty("ownRing", true);
     connect(made, &QComboBox::activated, this, [activated = std::move(activated)](int row) { activated(row); });
     bind(made, caption);
