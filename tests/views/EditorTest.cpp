@@ -1,13 +1,8 @@
 #include "PageLook.h"
 
-#include "editing/editor/tFrmNew.h"
-#include "selection/pictures/kyoskNew.h"
-#include "session/PageChain.h"
-#include "session/SessionState.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 
-#include <QTest>
 #include <QWidget>
 
 namespace lumora {
@@ -70,33 +65,6 @@ TEST_P(EditorLook, OpensTheOperatorsToolsWhereTheLabSaysSo) {
     walk.toEditor();
     go(walk,
        u"CommandImprove Frame5Opener :40-operator Command6 Command9 pic4Msgrt Command14 Command4 :41-operator-tools"_s);
-}
-
-// With the events of a mouse, as a scenario makes them.
-TEST(EditorByMouse, ZoomsWhileAButtonIsHeldAndMovesWhatIsDragged) {
-    Walk walk(Screen{{1024, 768}, true});
-    walk.toEditor();
-    auto& page = walk.page<tFrmNew>(PageId::tFrmNew);
-    const auto& edit = walk.program().state().edit;
-    const ControlFinder finder(walk.program().window());
-    const QString editor = u"tFrmNew"_s;
-    const auto record = [&] { return walk.page<kyoskNew>(PageId::kyoskNew).controls().List1.item(0).mid(9, 200); };
-
-    const Result<ControlFinder::Held> held = finder.hold(editor, u"Image2(0)"_s);
-    ASSERT_TRUE(held.ok());
-    walk.settle(420);
-    finder.letGo(*held);
-    const int after = page.controls().Label11.text.toInt();
-    EXPECT_GE(after, 104) << "it goes on while it is held";
-    walk.settle(200);
-    EXPECT_EQ(page.controls().Label11.text.toInt(), after) << "and stops when let go";
-
-    // Twenty moves of 2 percent of the paper: their distances from the press, a thirteenth of each.
-    const int before = edit.PanX;
-    ASSERT_TRUE(finder.drag(editor, u"PicPic"_s, {50, 50}, {90, 50}).ok());
-    walk.settle();
-    EXPECT_NEAR(edit.PanX - before, 450 * 0.02 * (20 * 21 / 2) / 13, 3);
-    EXPECT_EQ(record().mid(18, 4).trimmed(), QString::number(edit.PanX));
 }
 
 TEST(EditorByKeyboard, ReachesEachTool) {

@@ -105,6 +105,21 @@ QString rowsOf(const QAbstractItemModel& model) {
     return all;
 }
 
+// Of those that can be chosen.
+int leastRow(const QWidget& widget) {
+    int least = 44;
+    if (const auto* box = qobject_cast<const QComboBox*>(&widget); box && box->count() > 0) {
+        box->view()->ensurePolished();
+        least = box->view()->sizeHintForRow(0);
+    }
+    const auto* list = qobject_cast<const QListWidget*>(&widget);
+    for (int i = 0; list && list->focusPolicy() != Qt::NoFocus && i < list->count(); ++i) {
+        if (list->item(i)->flags() & Qt::ItemIsEnabled)
+            least = std::min(least, list->visualItemRect(list->item(i)).height());
+    }
+    return least;
+}
+
 bool insideScroller(const QWidget& widget) {
     for (const QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
         if (qobject_cast<const QAbstractScrollArea*>(parent))
@@ -361,13 +376,15 @@ QStringList Walk::faults() {
             button ||
             (qobject_cast<const QLineEdit*>(widget) && !qobject_cast<const QComboBox*>(widget->parentWidget())) ||
             qobject_cast<const QComboBox*>(widget);
-        const bool foreign =
-            insideScroller(*widget) || (widget->parentWidget() && widget->parentWidget()->inherits("QComboBox"));
+        const bool partOfBox = widget->parentWidget() && widget->parentWidget()->inherits("QComboBox");
+        const bool foreign = insideScroller(*widget) || partOfBox;
+        if (control && !partOfBox && (widget->width() < 44 || widget->height() < 44))
+            result += u"%1 is %2x%3, under 44"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height());
+        if (const int row = leastRow(*widget); row < 44)
+            result += u"%1 has rows of %2, under 44"_s.arg(nameOf(*widget)).arg(row);
         if (control && !foreign) {
             if (widget->objectName().isEmpty())
                 result += u"no object name: "_s + nameOf(*widget);
-            if (widget->width() < 44 || widget->height() < 44)
-                result += u"%1 is %2x%3, under 44"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height());
             const QRect whole = widget->rect();
             if (widget->visibleRegion().boundingRect() != whole)
                 result += u"%1 is cut off"_s.arg(nameOf(*widget));
