@@ -9,6 +9,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/Workspace.h"
+#include "views/kit/Theme.h"
 
 #include <QTest>
 #include <QTimer>
@@ -19,6 +20,24 @@ TEST(CarefulProgram, HoldsItsDataFolderAlone) {
     Walk walk(QSize(1280, 800), u"[Guards]\nCareful = yes\n"_s);
     const HostPath data = walk.program().platform().files.drives().dataFolder();
     EXPECT_TRUE(Instances(data, Instances::Lock::Shared).refused()) << "two programs would write one order";
+}
+
+TEST(Words, KeepTheDirectionOfCodesAndLoseTheBlanksAtTheEndsOfLines) {
+    // "<" and ">" stand for the signs that set a part apart.
+    for (const auto& [text, shown] :
+         {std::pair(u" יש שאלה? \nנשמח לעזור\t", u"יש שאלה?\nנשמח לעזור"),
+          {u"הזמנה 2026_11_21_KUP_1234^105 נשלחה.", u"הזמנה <2026_11_21_KUP_1234^105> נשלחה."},
+          {u"שלב 3 / 12, מ-10/15 ו-052-7654321.", u"שלב <3 / 12>, מ-<10/15> ו-<052-7654321>."},
+          {u"מס' 105   26.11.2026", u"מס' <105>   <26.11.2026>"},
+          {u"הקובץ Version 2.0 (3) נשמר", u"הקובץ <Version 2.0 (3)> נשמר"},
+          {u"נשלחו 3, 4, 5 (מתוך 12)", u"נשלחו <3>, <4>, <5> (מתוך <12>)"},
+          {u"אל lab@example.com: C:\\תמונות\\a b.jpg", u"אל <lab@example.com>: <C:\\תמונות\\a b.jpg>"},
+          {u"Press OK, then Send", u"Press OK, then Send"}}) {
+        QString once = isolated(QString::fromUtf16(text));
+        EXPECT_EQ(isolated(once), once);
+        EXPECT_EQ(once.replace(QChar(0x2066), u'<').replace(QChar(0x2069), u'>').toStdString(),
+                  QString::fromUtf16(shown).toStdString());
+    }
 }
 
 TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {

@@ -97,9 +97,8 @@ QWidget* SpltFormView::makeJoin() {
 
 QWidget* SpltFormView::makeResult() {
     m_resultSign = new QLabel(this);
-    QLabel* where = label(c.Label4Where, "smallMuted", [this](const QString& path) {
-        return path.isEmpty() ? path : atLineStart(fromLeft(path), state().english());
-    });
+    QLabel* where =
+        label(c.Label4Where, "smallMuted", [](const QString& path) { return path.isEmpty() ? path : fromLeft(path); });
     m_progress = new QProgressBar(this);
     m_progress->setRange(0, 100);
     m_progress->setTextVisible(false);

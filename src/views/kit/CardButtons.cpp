@@ -181,7 +181,8 @@ void DrawingCard::paintInside(QPainter& painter, const QRectF& room) {
     const int beside = small ? theme().size(Space::Small) : 0;
     const int below = small ? theme().size(Space::Tight) : 0;
     painter.drawText(line.adjusted(-beside, below, beside, below),
-                     Qt::AlignCenter | (small ? static_cast<int>(Qt::TextWordWrap) : 0), text());
+                     Qt::AlignCenter | (small ? static_cast<int>(Qt::TextWordWrap) : 0),
+                     small && !toolTip().isEmpty() ? text() + u'\n' + toolTip() : text());
 }
 
 void BorderSample::setCode(const QString& code) {

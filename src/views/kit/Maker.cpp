@@ -1,11 +1,91 @@
 #include "views/kit/Maker.h"
 
+#include <QPainter>
+#include <QStyle>
+#include <QStyleOption>
+#include <QTextLayout>
 #include <QVariant>
+
+#include <algorithm>
 
 namespace lumora {
 
+namespace {
+
+// Draws its words as the page reads, whatever letter they begin with; the text itself stays as it was set.
+class PageLabel : public QLabel {
+public:
+    using QLabel::QLabel;
+
+protected:
+    void paintEvent(QPaintEvent* event) override {
+        if (text().isEmpty() || !pixmap().isNull())
+            return QLabel::paintEvent(event);
+        const QString shown = isolated(text());
+        // In a row that runs from left to right in every language the words decide.
+        const Qt::LayoutDirection words = layoutDirection() == directionOfPage() ? layoutDirection()
+                                          : shown.isRightToLeft()                ? Qt::RightToLeft
+                                                                                 : Qt::LeftToRight;
+        const QRect room = contentsRect().adjusted(margin(), margin(), -margin(), -margin());
+        const QStringList lines = wordWrap() ? broken(shown, words, room.width()) : shown.split(u'\n');
+        QPainter painter(this);
+        drawFrame(&painter);
+        QStyleOption look;
+        look.initFrom(this);
+        const Qt::Alignment sides = QStyle::visualAlignment(words, alignment());
+        const int out = overhang(lines, words);
+        painter.translate(sides & Qt::AlignLeft ? out : sides & Qt::AlignRight ? -out : 0, 0);
+        const int flags = static_cast<int>(sides) | Qt::TextDontClip |
+                          (words == Qt::RightToLeft ? Qt::TextForceRightToLeft : Qt::TextForceLeftToRight);
+        style()->drawItemText(&painter, room, flags, look.palette, isEnabled(), lines.join(u'\n'), foregroundRole());
+    }
+
+private:
+    Qt::LayoutDirection directionOfPage() const {
+        const QWidget* page = this;
+        while (page->parentWidget() && !page->parentWidget()->isWindow())
+            page = page->parentWidget();
+        return page->layoutDirection();
+    }
+
+    // The lines that fit the width. The blank at which a line is broken goes, as Qt would draw it at the line's begin.
+    QStringList broken(const QString& text, Qt::LayoutDirection words, int width) const {
+        QTextOption option;
+        option.setTextDirection(words);
+        option.setWrapMode(QTextOption::WordWrap);
+        QStringList lines;
+        for (const QString& whole : text.split(u'\n')) {
+            QTextLayout layout(whole, font());
+            layout.setTextOption(option);
+            layout.beginLayout();
+            for (QTextLine line = layout.createLine(); line.isValid(); line = layout.createLine()) {
+                line.setLineWidth(width);
+                lines += whole.mid(line.textStart(), line.textLength()).trimmed();
+            }
+            layout.endLayout();
+            if (whole.isEmpty())
+                lines += whole;
+        }
+        return lines;
+    }
+
+    // How far the first letter of a line reaches out of the place where the line begins.
+    int overhang(const QStringList& lines, Qt::LayoutDirection words) const {
+        int out = 0;
+        for (const QString& line : lines) {
+            const auto first = std::find_if(line.begin(), line.end(), [](QChar sign) { return sign.isPrint(); });
+            if (first != line.end())
+                out = std::max(out, words == Qt::RightToLeft ? -fontMetrics().rightBearing(*first)
+                                                             : -fontMetrics().leftBearing(*first));
+        }
+        return out;
+    }
+};
+
+} // namespace
+
 QLabel* makeLabel(QWidget* parent, const char* type) {
-    auto* label = new QLabel(parent);
+    auto* label = new PageLabel(parent);
     label->setProperty("type", QString::fromLatin1(type));
     label->setTextFormat(Qt::PlainText);
     label->setWordWrap(true);

@@ -6,6 +6,7 @@
 #include <QPalette>
 #include <QRegularExpression>
 #include <QSize>
+#include <QStringList>
 #include <QStyleFactory>
 #include <QSvgRenderer>
 
@@ -15,6 +16,48 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+// A piece of a line without the signs of the sentence around it; told apart where it has more than words.
+QString apart(QString piece, bool behindLetter) {
+    static const QRegularExpression code(u"[0-9_@\\\\/^]|\\w\\.\\w"_s);
+    if (!code.match(piece).hasMatch())
+        return piece;
+    const auto lone = [&](QChar sign) {
+        return sign == u'(' ? !piece.contains(u')') : sign == u')' ? !piece.contains(u'(') : piece.count(sign) % 2 == 1;
+    };
+    qsizetype from = 0;
+    qsizetype to = piece.size();
+    while (piece[from] == u' ' || (behindLetter && piece[from] == u'-') ||
+           (u"(\"'"_s.contains(piece[from]) && lone(piece[from])))
+        ++from;
+    while (u".,;:!?- "_s.contains(piece[to - 1]) || (u"()\"'"_s.contains(piece[to - 1]) && lone(piece[to - 1])))
+        --to;
+    return piece.left(from) + fromLeft(piece.mid(from, to - from)) + piece.mid(to);
+}
+
+QString withCodesApart(const QString& line) {
+    if (line.contains(QChar(0x2066)))
+        return line;
+    // A path goes to the end of its line. What else stands together is told apart as one, or its words would change
+    // places; the parts of a list stay in its order.
+    static const QRegularExpression path(u"[A-Za-z]:\\\\.*|(?<!\\S)/[^\\s/][^/]*/.*"_s);
+    static const QRegularExpression together(u"(?![,;:])[!-~]+?(?: [!-~]+?)*(?=[,;:] |$|[^ -~]| (?![!-~]))"_s);
+    const qsizetype end = line.indexOf(path);
+    const QString words = line.left(end < 0 ? line.size() : end);
+    QString result;
+    qsizetype at = 0;
+    for (auto it = together.globalMatch(words); it.hasNext();) {
+        const auto match = it.next();
+        const bool behindLetter = match.capturedStart() > 0 && words[match.capturedStart() - 1].isLetter();
+        result += words.mid(at, match.capturedStart() - at) + apart(match.captured(), behindLetter);
+        at = match.capturedEnd();
+    }
+    return result + words.mid(at) + (end < 0 ? QString() : fromLeft(line.mid(end)));
+}
+
+} // namespace
 
 double Theme::factorFor(QSize window) {
     const double fit = std::min(window.width() / 1024.0, window.height() / 768.0);
@@ -178,25 +221,14 @@ QString atLineStart(const QString& text, bool english) {
 }
 
 QString isolated(const QString& text) {
-    // Paths, addresses of the web and of mail, names of files, sizes, "3 / 12", percentages, resolutions, telephone
-    // numbers.
-    static const QRegularExpression ownDirection(
-        u"[A-Za-z]:\\\\[^\\n]*|(?<!\\S)/[^/\\n]+/[^\\n]*|[\\w.+-]+@[\\w.-]*|https?://\\S+"
-        "|(?<!\\S)[!-~]+\\.[A-Za-z]{3}(?![\\w.])"
-        "|\\d+(?:\\s*[/x,_-]\\s*\\d+|[:.]\\d+)+(?:\\s?%)?|\\d+\\s?%|\\d+ dpi|\\+\\d+"_s);
     QString result = text;
     result.replace(u"\r\n"_s, u"\n"_s).replace(u'\r', u'\n');
     // Qt draws a right-to-left line that ends with a blank that much too far to the right, and the label cuts it.
-    static const QRegularExpression blanksAtLineEnd(u" +(?=\n|$)"_s);
-    result.remove(blanksAtLineEnd);
-    qsizetype shift = 0;
-    for (auto it = ownDirection.globalMatch(result); it.hasNext();) {
-        const auto match = it.next();
-        result.insert(match.capturedStart() + shift, QChar(0x2066));
-        result.insert(match.capturedEnd() + shift + 1, QChar(0x2069));
-        shift += 2;
-    }
-    return result;
+    static const QRegularExpression blanksAtLineEnds(u"(?:^|(?<=\n))[ \t]+|[ \t]+(?=\n|$)"_s);
+    result.remove(blanksAtLineEnds);
+    QStringList lines = result.split(u'\n');
+    std::transform(lines.begin(), lines.end(), lines.begin(), withCodesApart);
+    return lines.join(u'\n');
 }
 
 } // namespace lumora

@@ -42,22 +42,20 @@ void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_lis
 
 void SendingView::makeThanks(const Caption& prompt, const Caption& whole) {
     const SendingControls& shown = m_page.sendingControls();
-    const auto fromItsSide = [this](const QString& text) { return atLineStart(text, state().english()); };
-    m_thanks = inBox(inColumn(Space::None, {centred(label(shown.thanks, "display", fromItsSide)), Space::Normal,
-                                            centred(label(prompt, "muted")), centred(label(shown.shortNumber, "giant")),
-                                            centred(orderName(whole, "smallMuted"))}));
+    m_thanks = inBox(
+        inColumn(Space::None, {centred(label(shown.thanks, "display")), Space::Normal, centred(label(prompt, "muted")),
+                               centred(label(shown.shortNumber, "giant")), centred(orderName(whole, "smallMuted"))}));
     follow(m_thanks, shown.thanks);
 }
 
 QLayout* SendingView::makeFacts() {
     const SendingControls& shown = m_page.sendingControls();
-    const auto fromItsSide = [this](const QString& text) { return atLineStart(isolated(text), state().english()); };
     QGridLayout* facts = inGrid(Space::Tight);
     facts->setHorizontalSpacing(theme().size(Space::Normal));
     for (int i = 0; i < mostFacts; ++i) {
         const auto at = static_cast<std::size_t>(i);
         facts->addWidget(lineLabel(shown.factName[at], "muted"), i, 0, Qt::AlignTop);
-        facts->addWidget(label(shown.fact[at], "strong", fromItsSide), i, 1);
+        facts->addWidget(label(shown.fact[at], "strong"), i, 1);
     }
     facts->setColumnStretch(1, 1);
     return facts;
@@ -70,9 +68,8 @@ QPushButton* SendingView::makeChange() {
 }
 
 QLabel* SendingView::orderName(const Caption& caption, const char* type) {
-    return label(caption, type, [this](QString name) {
-        return name.isEmpty() ? name : atLineStart(fromLeft(name.replace(u'_', u"_\u200B"_s)), state().english());
-    });
+    return label(caption, type,
+                 [](QString name) { return name.isEmpty() ? name : fromLeft(name.replace(u'_', u"_\u200B"_s)); });
 }
 
 QPushButton* SendingView::asMain(SendingButton action, QPushButton* button) {
