@@ -5,18 +5,54 @@
 #include <QClipboard>
 #include <QDesktopServices>
 #include <QGuiApplication>
+#include <QStandardPaths>
 #include <QUrl>
 
 namespace lumora {
 
-void DesktopShell::openWebPage(const QString& url) {
-    if (!mayOpen || mayOpen())
-        QDesktopServices::openUrl(QUrl(url, QUrl::TolerantMode));
+using namespace Qt::StringLiterals;
+
+// What was opened stays open behind the program's end.
+DesktopShell::~DesktopShell() {
+    for (const std::unique_ptr<QProcess>& opener : m_openers)
+        opener->disconnect();
 }
 
-void DesktopShell::openFolder(const DrivePath& folder) {
-    if (const auto host = m_drives.toHost(folder); host && (!mayOpen || mayOpen()))
-        QDesktopServices::openUrl(QUrl::fromLocalFile(toText(*host)));
+void DesktopShell::openWebPage(const QString& url, NotOpened notOpened) {
+    open(QUrl(url, QUrl::TolerantMode), notOpened);
+}
+
+void DesktopShell::openFolder(const DrivePath& folder, NotOpened notOpened) {
+    if (const auto host = m_drives.toHost(folder))
+        open(QUrl::fromLocalFile(toText(*host)), notOpened);
+    else
+        notOpened();
+}
+
+// Qt starts the desktop's opener and does not hear how it ends, which tells that no program was found.
+void DesktopShell::open(const QUrl& url, const NotOpened& notOpened) {
+    if (mayOpen && !mayOpen())
+        return notOpened();
+    std::erase_if(m_openers, [](const auto& opener) { return opener->state() == QProcess::NotRunning; });
+    const QString program = m_opener ? QString() : QStandardPaths::findExecutable(u"xdg-open"_s);
+    if (program.isEmpty() || !url.isValid()) {
+        if (!url.isValid() || !(m_opener ? m_opener(url) : QDesktopServices::openUrl(url)))
+            notOpened();
+        return;
+    }
+    const auto& opener = m_openers.emplace_back(std::make_unique<QProcess>());
+    opener->setStandardInputFile(QProcess::nullDevice());
+    opener->setStandardOutputFile(QProcess::nullDevice());
+    opener->setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    QObject::connect(opener.get(), &QProcess::finished, [notOpened](int code, QProcess::ExitStatus) {
+        if (code != 0)
+            notOpened();
+    });
+    QObject::connect(opener.get(), &QProcess::errorOccurred, [notOpened](QProcess::ProcessError error) {
+        if (error == QProcess::FailedToStart)
+            notOpened();
+    });
+    opener->start(program, {url.toString(QUrl::FullyEncoded)});
 }
 
 void DesktopShell::copyToClipboard(const QString& text) {

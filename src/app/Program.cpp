@@ -1,6 +1,5 @@
 #include "app/Program.h"
 
-#include "app/DesktopShell.h"
 #include "app/PageRegister.h"
 #include "common/HostFile.h"
 #include "common/Warning.h"
@@ -55,7 +54,8 @@ HostPath doorProgram() {
 
 // Each member uses only those above it, as it is made.
 struct Program::Parts {
-    Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line, Cards::Source media)
+    Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line, Cards::Source media,
+          DesktopShell::Opener opener)
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
@@ -67,7 +67,7 @@ struct Program::Parts {
                  })
         , cards(deployment.watchedCards ? std::move(media) : Cards::Source(), deployment.door.everyFormat)
         , internet({}, deployment.ftpType)
-        , shell(drives)
+        , shell(drives, std::move(opener))
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, platform)
@@ -79,12 +79,7 @@ struct Program::Parts {
         , keeping(state, platform)
         , kioskPanels(window, state, chain, idle, staffCode) {
         // A browser would lie over the pages, and shows the files of this machine.
-        shell.mayOpen = [this] {
-            if (state.closedToCustomers())
-                dialogs.message(state.wording(u"במכשיר זה לא נפתחים אתרים ותיקיות.",
-                                              u"This machine opens no web pages and no folders."));
-            return !state.closedToCustomers();
-        };
+        shell.mayOpen = [this] { return !state.closedToCustomers(); };
         chain.mayEnd = [this] { return !state.closedToCustomers(); };
         kioskPanels.staffCameIn = [this] {
             dialogs.message(state.wording(u"כלי הצוות פתוחים עד שיחזור דף הפתיחה.",
@@ -203,7 +198,7 @@ Result<void> Program::start() {
         removeLeftovers(dataFolder, startTime);
 
     m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet,
-                                      m_options.media ? m_options.media : systemMedia);
+                                      m_options.media ? m_options.media : systemMedia, m_options.opener);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     QObject::connect(&parts.chain, &PageChain::shown, &parts.window, [&parts](const Page* page) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "app/DesktopShell.h"
 #include "common/Result.h"
 #include "platform/files/HostPath.h"
 #include "platform/media/Cards.h"
@@ -24,6 +25,7 @@ struct ProgramOptions {
     QSize windowSize;                   // an empty one leaves the size to the screen
     bool fullScreen = false;
     bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
+    DesktopShell::Opener opener;  // replaces the desktop's browser and file manager
     Internet* internet = nullptr; // replaces the machine's own line
     Cards::Source media;          // replaces the machine's own media, where the lab has them watched
 };

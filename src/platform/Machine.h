@@ -8,6 +8,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <functional>
 
 // Small interfaces of the machine that pages use.
 namespace lumora {
@@ -32,9 +33,10 @@ public:
 class Shell {
 public:
     virtual ~Shell() = default;
-    // Errors are ignored: with no browser or file manager nothing happens.
-    virtual void openWebPage(const QString& url) = 0;
-    virtual void openFolder(const DrivePath& folder) = 0;
+    // notOpened is called, perhaps later, where no browser or file manager shows it.
+    using NotOpened = std::function<void()>;
+    virtual void openWebPage(const QString& url, NotOpened notOpened) = 0;
+    virtual void openFolder(const DrivePath& folder, NotOpened notOpened) = 0;
     virtual void copyToClipboard(const QString& text) = 0;
     // Also what was marked and never copied.
     virtual void clearClipboard() = 0;

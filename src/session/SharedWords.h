@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/DrivePath.h"
 #include "common/Result.h"
 
 #include <QStringList>
@@ -9,8 +10,8 @@ namespace lumora {
 
 struct SessionState;
 
-// Why a file could not be used, as a customer reads it. The machine's own words go to standard error.
-QString failureWords(const SessionState& state, const Failure& failure);
+// Why this file could not be used, as a customer reads it.
+QString failureWords(const SessionState& state, const Failure& failure, const DrivePath& file);
 
 // The first most of the items, and how many more there are.
 QString shortList(const SessionState& state, const QStringList& items, qsizetype most, const QString& between);

@@ -1,4 +1,3 @@
-#include "common/Warning.h"
 #include "session/SessionState.h"
 #include "session/SharedWords.h"
 
@@ -8,15 +7,29 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-QString failureWords(const SessionState& state, const Failure& failure) {
-    writeWarning(failure.message);
+namespace {
+
+// The program's own drive and the root of the file system stay; every other letter is a card or a stick.
+bool mayBeTakenOut(const SessionState& state, const DrivePath& file) {
+    const QString drive = file.text().left(2).toUpper();
+    return drive.endsWith(u':') && drive != u"Z:"_s && drive != state.DiskRoot.text().left(2).toUpper();
+}
+
+} // namespace
+
+QString failureWords(const SessionState& state, const Failure& failure, const DrivePath& file) {
     switch (failure.kind) {
     case Failure::Kind::NoSpace:
         return state.wording(u"הדיסק מלא", u"The disk is full");
     case Failure::Kind::NotFound:
     case Failure::Kind::AccessDenied:
-        return state.wording(u"לא ניתן לקרוא את הקובץ. ייתכן שהכרטיס הוצא",
-                             u"The file can't be read. The card may have been taken out");
+        if (mayBeTakenOut(state, file))
+            return state.wording(u"לא ניתן לקרוא את הקובץ. ייתכן שהכרטיס הוצא",
+                                 u"The file can't be read. The card may have been taken out");
+        if (failure.kind == Failure::Kind::AccessDenied)
+            return state.wording(u"אין הרשאה לקרוא את הקובץ", u"This computer does not allow the file to be read");
+        return state.wording(u"הקובץ אינו במקומו. ייתכן שהועבר או נמחק",
+                             u"The file is not there any more. It may have been moved or deleted");
     case Failure::Kind::NoProgram:
         return state.wording(u"חסרה תוכנה במחשב זה", u"A program is missing on this computer");
     case Failure::Kind::Damaged:

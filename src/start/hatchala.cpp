@@ -1,8 +1,8 @@
 #include "start/hatchala.h"
 
-#include "platform/Machine.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
+#include "session/WebPages.h"
 #include "session/lab/ClientProfile.h"
 
 namespace lumora {
@@ -129,12 +129,12 @@ void hatchala::chooseShop(int row) {
 
 void hatchala::openPriceList() {
     loadProfile();
-    m_platform.shell.openWebPage(m_state.profile.PriceListUrl);
+    WebPages(m_state, m_platform).open(m_state.profile.PriceListUrl);
 }
 
 void hatchala::openSite() {
     loadProfile();
-    m_platform.shell.openWebPage(m_state.profile.SiteUrl);
+    WebPages(m_state, m_platform).open(m_state.profile.SiteUrl);
 }
 
 void hatchala::leaveProgram() {

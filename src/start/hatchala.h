@@ -25,6 +25,7 @@ struct hatchalaControls : Controls {
     Caption Image6{*this, u"Image6"};                          // how to reach the lab
     Caption Image3{*this, u"Image3"};                          // exit
     CheckCaption Check1{*this, u"Check1"};                     // "English Tips"
+    Caption Command4Ivrit{*this, u"Command4Ivrit"};            // in its place in English: back to Hebrew
     Caption Label1{*this, u"Label1"};                          // the lab's mail address
     Caption Label4Tel{*this, u"Label4Tel"};                    // the lab's telephone
     Caption Label4Tel2{*this, u"Label4Tel2"};                  // the same
@@ -102,6 +103,7 @@ public:
     void Image8_Click() { openSite(); }
     void Image3_MouseDown() { leaveProgram(); }
     void Check1_Click(bool checked) { setEnglish(checked); }
+    void Command4Ivrit_Click() { setEnglish(false); }
     void List1_Click(int row) { chooseShop(row); } // also when the row is chosen already
     void Command2_Click() { startWithShop(); }
     void Picture1_Escape() { putOffTheQuestion(); }

@@ -28,6 +28,7 @@ void hatchala::setTexts() {
                     {Image6, u"יצירת קשר עם המעבדה", u"Reach the lab"},
                     {Image3, u"יציאה", u"Exit", u"", u"Exit this program"},
                     {Check1, u"English Tips"},
+                    {Command4Ivrit, u"עברית"},
                     {Label3, u"", u"With this button \nyou can navigaet \nTo our site"},
                     {Label4, u"", u"With this button \nyou can exit \n"},
                     {Picture3, u"מה עושה הכפתור?",
@@ -47,6 +48,8 @@ void hatchala::setTexts() {
                     {Command6, u"open zofen"},
                 });
     Image8.text = QUrl(m_state.profile.SiteUrl).host();
+    Check1.visible = !m_state.english();
+    Command4Ivrit.visible = m_state.english();
     Label3.visible = Label4.visible = m_state.english();
     Image3.visible = !m_state.closedToCustomers();
     Label4.visible = Label4.visible && Image3.visible;
@@ -94,7 +97,7 @@ void hatchala::showDigits() {
     setCaptions(m_state,
                 {
                     {Command4Achar, u"זו לא ההזמנה שלי", u"It is not my order"},
-                    {Label4Hemshech, u"זו ההזמנה שלכם? הקישו את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
+                    {Label4Hemshech, u"זו ההזמנה שלכם? נא להקיש את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
                      u"Is it yours? Type the last three digits of the telephone number of the order."},
                     {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not match. Please try again."},
                     {Command4Mehak, u"", u"", u"מחק ספרה", u"Take back a digit"},

@@ -307,6 +307,8 @@ TEST_F(ThePictures, takeTheEditorWithThemWhenTheyGo) {
     editor().Image15_Click();
     editor().Image2_MouseDown(0);
     editor().Timer2_Tick(); // still held, and the editor not left
+    page.Command4Safa_Click();
+    EXPECT_EQ(editor().controls().Image13.text, u"Tones"_s);
     page.Image7_Click();
     EXPECT_FALSE(page.controls().Picture7.visible) << "deep compression is asked for plain orders only";
     page.Command7_Click();
@@ -371,8 +373,11 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     page.Image7_Click();
     EXPECT_EQ(page.controls().Label19.text + page.controls().Label20.text, u"10/153"_s);
     page.Text1_Change(u"dana"_s);
+    EXPECT_EQ(page.controls().Label33Word.text, u"אפשר להמשיך גם בלעדיה"_s) << "half an address";
     page.Combo1_Change(u"example.com"_s);
     page.Text2_Change(u"gift"_s);
+    page.Command4Safa_Click(); // to English, with all that was chosen and typed
+    EXPECT_EQ(page.controls().Label33Word.text, u"✓ filled in"_s);
     int handOvers = 0;
     QObject::connect(&chain, &PageChain::shown, [&](Page* shown) { handOvers += shown->id() == PageId::Form2; });
     machine.pump.onPump = [&] { page.Command8_Click(); }; // an impatient second press

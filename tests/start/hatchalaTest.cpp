@@ -263,6 +263,17 @@ TEST_F(hatchalaTest, AsksForTheShopWhereTheLabWantsIt) {
     }
 }
 
+TEST_F(hatchalaTest, CarefullyAndOnAKioskAPageOfTheSiteThatNothingShowsIsTold) {
+    hatchala& page = start();
+    machine.shell.opens = false;
+    for (const auto& [careful, kiosk, told] : {std::tuple(false, false, 0), {true, false, 1}, {false, true, 2}}) {
+        deployment.Careful = careful;
+        deployment.kiosk.on = kiosk;
+        page.Image11_Click();
+        EXPECT_EQ(machine.dialogs.messages.size(), told);
+    }
+}
+
 TEST_F(hatchalaTest, TheAdvertisingPictureComesFromTheSiteOrTheInstallationAndMoves) {
     hatchala& page = start();
     page.Timer2_Tick();

@@ -73,11 +73,16 @@ private:
 
 class RecordedShell : public Shell {
 public:
-    void openWebPage(const QString& url) override { webPages += url; }
-    void openFolder(const DrivePath& folder) override { folders += folder.text(); }
+    void openWebPage(const QString& url, NotOpened notOpened) override {
+        webPages += url;
+        if (!opens)
+            notOpened();
+    }
+    void openFolder(const DrivePath& folder, NotOpened) override { folders += folder.text(); }
     void copyToClipboard(const QString& text) override { clipboard = text; }
     void clearClipboard() override { clipboard.clear(); }
 
+    bool opens = true;
     QStringList webPages;
     QStringList folders;
     QString clipboard;

@@ -49,7 +49,7 @@ TEST(Panel, LeavesThePageBelowInSightAndUsableWhereItIsNotCovered) {
     walk.settle(100);
     ASSERT_TRUE(window.viewBelow());
     EXPECT_EQ(window.frontView()->width(), 1920);
-    walk.press(start, u"Check1"_s);
+    walk.press(start, u"Command4Ivrit"_s);
 }
 
 TEST(LargePicture, ShadesWhatThePaperDoesNotTake) {

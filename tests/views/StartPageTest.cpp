@@ -1,5 +1,6 @@
 #include "PageLook.h"
 
+#include "app/DesktopShell.h"
 #include "imaging/files/PictureFile.h"
 #include "order/OrderState.h"
 #include "platform/Platform.h"
@@ -8,6 +9,7 @@
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "start/hatchala.h"
+#include "support/TestPlatform.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 
@@ -122,6 +124,29 @@ TEST_P(StartLook, OffersAnOrderThatWasNotFinished) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Screens, StartLook, PageLook::screens(), PageLook::nameOf);
+
+TEST(DesktopShell, TellsOfEachPageThatNothingShows) {
+    TestPlatform machine;
+    QFile opener(machine.folder.filePath(u"xdg-open"_s));
+    ASSERT_TRUE(opener.open(QIODevice::WriteOnly));
+    opener.write("#!/bin/sh\ncase $1 in *seen*) exit 0 ;; esac\nexit 3\n");
+    opener.close();
+    opener.setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    const QByteArray path = qgetenv("PATH");
+    qputenv("PATH", machine.folder.path().toLocal8Bit() + ':' + path);
+    DesktopShell shell(machine.drives);
+    QStringList told;
+    const auto tell = [&](const QString& what) { return [&told, what] { told += what; }; };
+    shell.openWebPage(u"http://seen.example/"_s, tell(u"seen"_s));
+    shell.openWebPage({}, tell(u"none"_s));
+    shell.openFolder(u"X:\\orders"_path, tell(u"no drive"_s));
+    shell.openFolder(u"C:\\orders"_path, tell(u"folder"_s));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return told.size() == 3; }, 20000));
+    shell.mayOpen = [] { return false; };
+    shell.openWebPage(u"http://seen.example/"_s, tell(u"closed"_s));
+    EXPECT_EQ(told, QStringList({"none", "no drive", "folder", "closed"}));
+    qputenv("PATH", path);
+}
 
 TEST(StartPage, HelpsAMouseAFingerAndTheKeyboard) {
     Walk walk({1024, 768});

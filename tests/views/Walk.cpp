@@ -128,29 +128,33 @@ bool insideScroller(const QWidget& widget) {
     return false;
 }
 
-QString clippedText(const QWidget& widget) {
-    if (const auto* label = qobject_cast<const QLabel*>(&widget)) {
-        if (label->text().isEmpty() || !label->pixmap().isNull())
-            return {};
-        if (label->layoutDirection() == Qt::RightToLeft && label->text().contains(u" \n"_s))
-            return u"a line of \"%1\" ends with a blank, which pushes it out of its label"_s.arg(label->text());
-        const QSize needed =
-            label->wordWrap()
-                ? QSize(label->fontMetrics()
-                            .boundingRect(QRect(0, 0, label->width(), 10000), Qt::TextWordWrap, label->text())
-                            .width(),
-                        label->heightForWidth(label->width()))
-                : label->sizeHint();
-        if (needed.width() > label->width() + 1 || needed.height() > label->height() + 1)
-            return u"text \"%1\" needs %2x%3 and has %4x%5"_s.arg(label->text())
-                .arg(needed.width())
-                .arg(needed.height())
-                .arg(label->width())
-                .arg(label->height());
-    } else if (qobject_cast<const QPushButton*>(&widget) || widget.inherits("QCheckBox")) {
-        if (widget.sizeHint().width() > widget.width() + 1)
-            return u"needs %1 and is %2 wide"_s.arg(widget.sizeHint().width()).arg(widget.width());
+// Drawn with room around it, the label puts ink outside its place. The rim of a letter may reach a pixel out.
+bool cutsInk(QLabel& label) {
+    constexpr int room = 30;
+    constexpr int rim = 1;
+    const QRect place = label.geometry();
+    const QMargins margins = label.contentsMargins();
+    label.setContentsMargins(margins + room);
+    label.setGeometry(place + QMargins(room, room, room, room));
+    QImage drawn(label.size(), QImage::Format_Alpha8);
+    drawn.fill(0);
+    label.render(&drawn, {}, {}, QWidget::RenderFlags());
+    label.setContentsMargins(margins);
+    label.setGeometry(place);
+    const QRect seen(QPoint(room - rim, room - rim), place.size() + QSize(2 * rim, 2 * rim));
+    for (int y = 0; y < drawn.height(); ++y) {
+        for (int x = 0; x < drawn.width(); ++x) {
+            if (!seen.contains(x, y) && drawn.constScanLine(y)[x] > 64)
+                return true;
+        }
     }
+    return false;
+}
+
+QString clippedText(const QWidget& widget) {
+    if ((qobject_cast<const QPushButton*>(&widget) || widget.inherits("QCheckBox")) &&
+        widget.sizeHint().width() > widget.width() + 1)
+        return u"needs %1 and is %2 wide"_s.arg(widget.sizeHint().width()).arg(widget.width());
     return {};
 }
 
@@ -170,6 +174,10 @@ Walk::Walk(QSize size, const QString& labSettings, Internet* line, Cards::Source
     options.dataFolder = root / "drive_c";
     options.windowSize = size;
     options.internet = line;
+    options.opener = [this](const QUrl& url) {
+        opened += url.toString();
+        return true;
+    };
     options.media = std::move(media);
     m_program = std::make_unique<Program>(std::move(options));
     const Result<void> started = m_program->start();
@@ -368,7 +376,7 @@ QStringList Walk::faults() {
             }
         }
     }
-    for (const QWidget* widget : root->findChildren<QWidget*>()) {
+    for (QWidget* widget : root->findChildren<QWidget*>()) {
         if (!widget->isVisible() || widget->size().isEmpty())
             continue;
         const auto* button = qobject_cast<const QAbstractButton*>(widget);
@@ -393,6 +401,8 @@ QStringList Walk::faults() {
             const QString clipped = clippedText(*widget);
             if (!clipped.isEmpty())
                 result += u"%1: %2"_s.arg(nameOf(*widget), clipped);
+            if (auto* label = qobject_cast<QLabel*>(widget); label && !label->text().isEmpty() && cutsInk(*label))
+                result += u"%1 \"%2\" loses ink at an edge"_s.arg(nameOf(*label), label->text());
             if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
                 result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
         }

@@ -86,6 +86,8 @@ public:
     void write(const DrivePath& path, const QByteArray& bytes);
     // Writes the window to the folder that LUMORA_SHOTS names; without one nothing is written.
     void shot(const QString& name);
+    // What the desktop was asked to open.
+    QStringList opened;
     // All that is wrong with what the window shows now: each line names the control.
     QStringList faults();
 

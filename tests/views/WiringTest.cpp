@@ -1,6 +1,5 @@
 #include "Walk.h"
 
-#include "drive/NothingOpens.h"
 #include "editing/redeye/RedI.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
@@ -105,7 +104,6 @@ private:
 
     FakeWebLab m_lab;
     Walk m_walk;
-    NothingOpens m_opened;
     SessionState& m_state = m_walk.program().state();
     MainWindow& m_window = m_walk.program().window();
     ScreenDialogs& m_dialogs = m_walk.program().dialogs();
@@ -139,7 +137,7 @@ QString Scene::fact(const QString& name) {
                                             {u"front"_s, front()},
                                             {u"ended"_s, chain.hasEnded()},
                                             {u"box"_s, m_dialogs.shownTexts.join(u'|')},
-                                            {u"opened"_s, m_opened.taken.join(u'|')},
+                                            {u"opened"_s, m_walk.opened.join(u'|')},
                                             {u"copied"_s, QApplication::clipboard()->text()},
                                             {u"asked"_s, m_lab.urls.join(u'|')}};
     const PageView* view = m_window.frontView();

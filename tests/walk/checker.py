@@ -250,7 +250,7 @@ class Walk:
             choice = promise['choice']
             same('the paper of the choice', paper, choice[0])
             kind = 'G' if choice[1] in GLOSSY else 'M' if choice[1] in MATTE else '?'
-            bordered = [BORDERS.get(words, words.rpartition(' ')[2]) for words in choice[2:] if 'מסגרת' in words or 'order' in words]
+            bordered = [BORDERS.get(words, words.partition(':')[0].rpartition(' ')[2]) for words in choice[2:] if 'מסגרת' in words or 'order' in words]
             same('fit or fill', field('FillFit'), 'FIT' if choice[-1] in WITH_MARGINS else 'FIL')
             if bordered:
                 same('the border', field('Bord'), bordered[0])

@@ -1,10 +1,10 @@
 #include "app/Program.h"
-#include "drive/NothingOpens.h"
 #include "drive/RandomWalk.h"
 #include "drive/ScenarioPlayer.h"
 #include "views/window/Application.h"
 
 #include <QCommandLineParser>
+#include <QUrl>
 
 #include <cstdio>
 #include <cstdlib>
@@ -41,7 +41,6 @@ int startFailure(const Result<void>& started) {
 
 // The walk goes on where the customer has ended the program and starts it again.
 int walk(RandomWalk& walk, const ProgramOptions& options) {
-    const NothingOpens nothingOpens;
     while (!walk.isOver()) {
         Program program(options);
         if (const Result<void> started = program.start(); !started)
@@ -89,6 +88,7 @@ int play(int argc, char** argv) {
         parser.showVersion();
 
     ProgramOptions options;
+    options.opener = [](const QUrl&) { return true; };
     options.windowSize = sizeIn(parser.value(u"size"_s));
     if (options.windowSize.isEmpty())
         return complain(u"--size: %1 is no size such as 1280x1024"_s.arg(parser.value(u"size"_s)), notPlayed);

@@ -2,6 +2,7 @@
 
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
+#include "common/Warning.h"
 #include "editing/editor/BigPics.h"
 #include "editing/render/EditedPicture.h"
 #include "order/EditRecord.h"
@@ -160,8 +161,9 @@ bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
     Result<EditedPreview> opened =
         EditedPreview::open(file, paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
+        writeWarning(opened.failure().message);
         tell(u"לא ניתן לפתוח את התמונה לעריכה"_s, u"The picture can't be opened for editing"_s,
-             failureWords(m_state, opened.failure()));
+             failureWords(m_state, opened.failure(), path));
         return false;
     }
     surfaces().open(std::move(*opened));

@@ -16,6 +16,7 @@
 #include "platform/files/Drives.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/WebPages.h"
 #include "session/Workspace.h"
 
 // What the customer does on the page. nnnSteps.cpp has the steps and what each shows, nnnTexts.cpp what the page says.
@@ -321,7 +322,7 @@ void nnn::takeFit(const CheckCaption& taken) {
 // --- terms, and on to the pictures ---
 
 void nnn::readTerms() {
-    m_platform.shell.openWebPage(m_state.profile.SiteUrl);
+    WebPages(m_state, m_platform).open(m_state.profile.SiteUrl);
 }
 
 void nnn::closeTermsHint() {

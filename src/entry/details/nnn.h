@@ -59,6 +59,7 @@ public:
     void Command7_Click() { cleanHistory(); }
     void Command9_Click() { askToClean(false); }
     void Command15_Click() { showNotice(); }
+    void Command4Anglit_Click() { turnTo(Language::English); }
     void Command4Ivrit_Click() { turnTo(Language::Hebrew); }
 
     // Called by nothing: nnnUnused.cpp.
@@ -96,6 +97,7 @@ private:
     void goOnFrom(Step from);
     void showStep();
     void showProgress(const std::vector<StepRow>& table);
+    QString chosenBorder() const;
     QString choiceSoFar() const;
 
     void takeTile(int tile);

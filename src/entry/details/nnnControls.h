@@ -12,10 +12,12 @@ struct nnnControls : Controls {
     Caption Label4Tel{*this, u"Label4Tel"}; // the lab's telephone, for a question
     Caption Command2{*this, u"Command2"};   // cancel
     Caption Command4{*this, u"Command4"};   // one step back
+    // To the other language, in its own word; the menu has a tile to English.
+    Caption Command4Anglit{*this, u"Command4Anglit"};
+    Caption Command4Ivrit{*this, u"Command4Ivrit"};
 
     // The menu.
     ControlArray<Caption, 10> Image1{*this, u"Image1"};    // tiles, with a line of explanation as hint
-    Caption Command4Ivrit{*this, u"Command4Ivrit"};        // the way back to Hebrew, in English
     int markedTile = -1;                                   // of the tiles 0 to 2
     Caption Command14{*this, u"Command14"};                // asks whether to clean the history
     Caption Command15{*this, u"Command15"};                // clarifications and warnings

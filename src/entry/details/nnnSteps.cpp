@@ -3,6 +3,7 @@
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
 #include "entry/details/TileMenu.h"
+#include "order/ChoiceWords.h"
 #include "session/SessionState.h"
 
 #include <algorithm>
@@ -35,7 +36,7 @@ std::vector<nnn::StepRow> nnn::stepTable() {
          u"גודל וסוג נייר",
          u"Paper size and kind",
          {&Frame4, &LabelSizes, &LabelKinds, &Combo1, &Option3[0], &Option3[1]}},
-        {Step::Border, prints && m_state.GvulMuzag == 1, u"בחרו מסגרת", u"Choose a border", {&Picture4}},
+        {Step::Border, prints && m_state.GvulMuzag == 1, u"בחירת מסגרת", u"Choose a border", {&Picture4}},
         {Step::Fit,
          prints && m_state.FitMuzag,
          u"התאמה או מילוי",
@@ -99,7 +100,9 @@ void nnn::showStep() {
     const auto tiles = visibleTiles(m_state);
     for (std::size_t i = 0; i < Image1.size(); ++i)
         Image1[i].visible = menu && tiles[i];
-    Command4Ivrit.visible = menu && m_state.english();
+    Image1[EnglishTile].visible = Image1[EnglishTile].visible && !m_state.english();
+    Command4Anglit.visible = !menu && !m_state.english();
+    Command4Ivrit.visible = m_state.english();
     Command14.visible = menu && m_state.MinuyPaar != 2 && !m_state.closedToCustomers();
     if (m_state.kiosk.on)
         Check2.visible = Command10.visible = false;
@@ -116,8 +119,8 @@ void nnn::showStep() {
     Command8.visible = options && (Option3[0].checked || Option3[1].checked);
     Command8.enabled = m_state.shemot.ppr != notChosen;
     Command6.visible = m_step == Step::Border && Picture16 >= 0;
-    LabelPicture16.text = Picture16 >= 0 ? Image13[static_cast<std::size_t>(Picture16)].text
-                                         : m_state.wording(u"עדיין לא נבחרה מסגרת", u"No border chosen yet");
+    LabelPicture16.text =
+        Picture16 >= 0 ? chosenBorder() : m_state.wording(u"עדיין לא נבחרה מסגרת", u"No border chosen yet");
     LabelTerms.visible = Command30.visible = m_step == Step::Terms && m_termsHint;
     Label4Tel.text = m_state.profile.LabPhone;
     showProgress(table);
@@ -143,6 +146,11 @@ void nnn::showProgress(const std::vector<StepRow>& table) {
     Choice.visible = ofAlbum ? album.ChoiceSoFar.visible : !Choice.text.isEmpty() && m_step != Step::Terms;
 }
 
+QString nnn::chosenBorder() const {
+    const Caption& border = Image13[static_cast<std::size_t>(Picture16)];
+    return border.hint.isEmpty() ? border.text : u"%1: %2"_s.arg(border.text, border.hint);
+}
+
 QString nnn::choiceSoFar() const {
     QStringList choice;
     if (m_step == Step::Menu || m_step == Step::Details)
@@ -150,9 +158,9 @@ QString nnn::choiceSoFar() const {
     if (m_state.shemot.ppr != notChosen)
         choice += m_state.shemot.ppr;
     if (m_state.shemot.maat != notChosen)
-        choice += m_state.shemot.maat;
+        choice += paperWord(m_state, m_state.shemot.maat);
     if (Picture16 >= 0)
-        choice += Image13[static_cast<std::size_t>(Picture16)].text;
+        choice += chosenBorder();
     if (m_step == Step::Terms && (Option4.checked || Option5.checked))
         choice += Option4.checked ? Option4.text : Option5.text;
     return choice.join(u" · "_s);

@@ -1,6 +1,7 @@
 #include "entry/details/TileMenu.h"
 #include "entry/details/nnn.h"
 
+#include "order/ChoiceWords.h"
 #include "order/HistoryState.h"
 #include "order/OrderFolder.h"
 #include "platform/Dialogs.h"
@@ -93,12 +94,16 @@ void nnn::setTexts() {
                               u"Tick the box before you go on to the pictures"},
                              {Label8, u"V  V  V", u"V  V  V"},
 
-                             {Command4Ivrit, u"עברית", u"עברית"},
+                             {Command4Anglit, u"English"},
+                             {Command4Ivrit, u"עברית"},
                              {Command14, u"ניקיון היסטוריה", u"Clean the history"},
                              {Command15, u"הבהרות ואזהרות", u"Clarifications and warnings"},
                              {Command7, u"נקה", u"Clean"},
                              {Command9, u"השאר", u"Keep them"},
                          });
+    // The first and the last card say in their name how they look.
+    for (std::size_t i = 1; i + 1 < Image13.size(); ++i)
+        Image13[i].hint = borderWords(m_state, borderCode(static_cast<int>(i)));
     if (!Combo1.taken() && m_state.shemot.ppr != Combo1.text)
         Combo1.text = sizesPrompt();
     m_album.setTexts();

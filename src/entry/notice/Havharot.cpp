@@ -68,15 +68,20 @@ void Havharot::endProgram() {
 }
 
 void Havharot::openMailProgram() {
-    m_platform.shell.openWebPage(u"mailto:"_s);
+    m_platform.shell.openWebPage(u"mailto:"_s, [&state = m_state, &platform = m_platform] {
+        if (state.Careful || state.closedToCustomers())
+            platform.dialogs.message(
+                state.wording(u"במחשב זה אין תוכנת דואר. לתוכנה זו אין צורך בה.",
+                              u"There is no mail program on this computer. This program needs none."));
+    });
 }
 
 void Havharot::tellHowToSetUpMail() {
-    m_platform.dialogs.message(
-        m_state.wording(u"לתוכנה זו אין צורך בתוכנת דואר.\nלשימוש אחר: פתחו את הגדרות המערכת, בחרו יישומי ברירת מחדל,\n"
-                        u"וקבעו שם את תוכנת הדואר.",
-                        u"This program needs no mail program.\nFor other uses open the system settings, choose the "
-                        u"default applications,\nand set the mail program there."));
+    m_platform.dialogs.message(m_state.wording(
+        u"לתוכנה זו אין צורך בתוכנת דואר.\nלשימוש אחר: יש לפתוח את הגדרות המערכת, לבחור יישומי ברירת מחדל,\n"
+        u"ולקבוע שם את תוכנת הדואר.",
+        u"This program needs no mail program.\nFor other uses open the system settings, choose the "
+        u"default applications,\nand set the mail program there."));
 }
 
 } // namespace lumora

@@ -29,8 +29,8 @@ public:
 
     // A picture that the disk has not taken is told at once, before "finish", but once only.
     bool tellsAtOnce(const QString& path);
-    // Of the first that is not made after a count.
-    QString notMadeWords() const { return notMadeWords(m_notMade); }
+    // The first that is not made after a count.
+    const QString& notMade() const { return m_notMade; }
     QString notMadeWords(const QString& path) const;
 
     void takeOut(const QString& name) { m_takenOut += name; }

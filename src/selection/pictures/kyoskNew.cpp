@@ -8,11 +8,11 @@
 #include "order/CouponLimit.h"
 #include "order/EditRecord.h"
 #include "platform/Dialogs.h"
-#include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/door/PictureDoor.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
+#include "session/WebPages.h"
 
 #include <QTimer>
 
@@ -71,7 +71,7 @@ void kyoskNew::load() {
     Text1.visible = Combo1.visible = box == AddressBox::Mail;
     Txt4Ml2.visible = box == AddressBox::AlbumMail;
     Label17.visible = Command8.visible = box != AddressBox::None;
-    Label33.visible = box != AddressBox::None && !m_state.DoarReshut;
+    Label33.visible = Label33Word.visible = box != AddressBox::None && !m_state.DoarReshut;
 
     const HandOver before = std::exchange(m_state.handOver, {});
     openDoor(before);
@@ -147,8 +147,8 @@ void kyoskNew::showCell(int cell) {
                           : m_door->isUnreadable(path) ? name + u", "_s + Picture1[at].unreadable
                           : m_choice.chosen(cell)
                               ? m_state.wording(u"%1, נבחרה, עותקים: %2", u"%1, chosen, copies: %2").arg(name, copies)
-                          : plain() ? words(u"%1, לחץ לבחירה", u"%1, press to choose")
-                                    : words(u"%1, לחץ לעריכה", u"%1, press to edit");
+                          : plain() ? words(u"%1, לחיצה בוחרת", u"%1, press to choose")
+                                    : words(u"%1, לחיצה פותחת לעריכה", u"%1, press to edit");
     if (prints)
         Picture1[at].spoken +=
             u", "_s + ResolutionDots(*prints) + u": "_s + ResolutionWord(prints->grade(), m_state.english());
@@ -182,8 +182,13 @@ void kyoskNew::turnHelp() {
     Q_EMIT changed();
 }
 
+void kyoskNew::turnLanguage() {
+    m_state.EnglishTips = m_state.english() ? 0 : 1;
+    m_chain.setTexts(); // also of the editor, which is loaded behind this page
+}
+
 void kyoskNew::openPriceList() {
-    m_platform.shell.openWebPage(m_state.profile.PriceListUrl);
+    WebPages(m_state, m_platform).open(m_state.profile.PriceListUrl);
 }
 
 } // namespace lumora

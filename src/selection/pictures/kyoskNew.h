@@ -75,6 +75,7 @@ public:
     void Image4_Click() { turnLargeView(); }
     void Picture2_Click() { lookInLarge(); }
     void Image6_Click() { turnHelp(); }
+    void Command4Safa_Click() { turnLanguage(); }
     void Image11_Click() { openPriceList(); }
     void Image17_Click() { openPriceList(); }
 
@@ -136,6 +137,7 @@ public:
     bool typesCopies() const;
     // The box of the closing panel that takes the address.
     AddressBox addressBox() const;
+    bool addressTyped() const;
     // The box that takes the keyboard next; a view moves the focus when the number has changed.
     const QString& focusBox() const { return m_focusBox; }
     int focusRequest() const { return m_focusRequest; }
@@ -171,7 +173,7 @@ private:
     void noteCards();
     void cardsChanged();
     void copySettled(const QString& path);
-    void tellNotKept(const Failure& why);
+    void tellNotKept(const Failure& why, const DrivePath& picture);
     void tellMissing();
     void askForMissing();
     bool isCopied(const QString& path) const;
@@ -195,6 +197,7 @@ private:
     void lookInLarge();
     void turnHelp();
     void openPriceList();
+    void turnLanguage();
 
     void choosePicture(int cell);
     void takeIntoEditor(const QString& path);
@@ -220,6 +223,7 @@ private:
     QStringList nextPictures() const;
     void orderPictures(const QStringList& next = {});
     void pictureSettled(const QString& path);
+    void tellNotMade(const QString& path);
     void showDraft(const QString& path);
     void findUnreadable(const QString& path, const Failure& why);
     void takeOutUnreadable(const QString& path);
@@ -255,6 +259,7 @@ private:
     void showCoarsePictures();
     void closeFinish();
     void openBranches();
+    void nameBranches();
     void offerBranches();
     void chooseBranch(int branch);
     void showBranch(int branch);
@@ -263,7 +268,8 @@ private:
     void focusOn(const QString& box);
     void focusOnFirstPicture();
     void setDeepCompression(bool deep);
-    void type(Caption& box, const QString& text) { box.text = text; }
+    void type(Caption& box, const QString& text);
+    void showAddressWord();
     void typeAlbumMail(const QString& text);
     void typeDomain(const QString& text);
     void chooseDomain(int index);

@@ -89,6 +89,7 @@ struct kyoskNewControls : Controls {
     Caption cardNote{*this, u"cardNote"};                          // what it holds
     Caption cardCopies{*this, u"cardCopies", Caption::At::Hidden}; // how far what was chosen from it is copied
     Caption Image4{*this, u"Image4", Caption::At::Hidden};         // with a picture in the large view
+    Caption Command4Safa{*this, u"Command4Safa"};                  // to the other language, in its own word
     Caption Image5{*this, u"Image5"};
     Caption Image6{*this, u"Image6"};
     Caption Image7{*this, u"Image7"};
@@ -142,6 +143,7 @@ struct kyoskNewControls : Controls {
     Caption showCoarse{*this, u"showCoarse", Caption::At::Hidden}; // leads to them
     Caption Label17{*this, u"Label17"};                            // prompt of the address
     Caption Label33{*this, u"Label33"};                            // the address is required
+    Caption Label33Word{*this, u"Label33Word"};                    // whether it is there, and the way without it
     Caption Text1{*this, u"Text1"};                                // the address before its "@"
     SpokenCaption Combo1{*this, u"Combo1"};                        // and behind it, as chosen or typed
     QStringList Combo1Items;

@@ -1,5 +1,6 @@
 // The page of pictures: what is chosen from a card is copied, so that the card may go.
 #include "common/FixedText.h"
+#include "common/Warning.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "selection/CardWords.h"
@@ -97,7 +98,7 @@ void kyoskNew::cardsChanged() {
 
 void kyoskNew::copySettled(const QString& path) {
     if (copyState(path) == CopyState::NotKept && m_choice.inBasket(path) && !m_notKeptTold)
-        tellNotKept(m_copies->failureOf(path));
+        tellNotKept(m_copies->failureOf(path), shownPath(path));
     tellMissing();
     showCards();
     if (m_wait.waits())
@@ -105,14 +106,15 @@ void kyoskNew::copySettled(const QString& path) {
     Q_EMIT changed();
 }
 
-void kyoskNew::tellNotKept(const Failure& why) {
+void kyoskNew::tellNotKept(const Failure& why, const DrivePath& picture) {
     m_notKeptTold = true;
+    writeWarning(why.message);
     m_platform.dialogs.message(
         m_state
             .wording(
                 u"לא ניתן להעתיק את התמונות מהכרטיס.\nנא להשאיר את הכרטיס עד סוף ההזמנה.\n%1",
                 u"The pictures can't be copied from the card.\nPlease leave the card in until the order is done.\n%1")
-            .arg(failureWords(m_state, why)));
+            .arg(failureWords(m_state, why, picture)));
 }
 
 QString kyoskNew::namesOf(const QStringList& paths) const {

@@ -1,4 +1,5 @@
 // The page of pictures: those that are no ordinary JPEG files, and are made ready in the background.
+#include "common/Warning.h"
 #include "order/DoorFolders.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -77,7 +78,7 @@ void kyoskNew::pictureSettled(const QString& path) {
         return;
     const bool pulled = m_copies && m_copies->stateOf(path) == CardCopies::State::Missing;
     if (!pulled && m_wait.tellsAtOnce(path))
-        m_platform.dialogs.message(m_wait.notMadeWords(path));
+        tellNotMade(path);
     takeOutUnreadable(path);
     const QStringList chosen = m_choice.basket().paths();
     const bool anyWaits = std::ranges::any_of(chosen, [this](const QString& one) { return m_door->isWaiting(one); });
@@ -97,6 +98,11 @@ void kyoskNew::pictureSettled(const QString& path) {
     else if (m_wait.waits())
         showWaiting();
     Q_EMIT changed();
+}
+
+void kyoskNew::tellNotMade(const QString& path) {
+    writeWarning(m_door->failureOf(path).message);
+    m_platform.dialogs.message(m_wait.notMadeWords(path));
 }
 
 void kyoskNew::showDraft(const QString& path) {
@@ -156,7 +162,7 @@ void kyoskNew::showWaiting() {
     else if (then == DoorWait::Then::GoOn)
         (this->*m_onceMade)();
     else
-        m_platform.dialogs.message(m_wait.notMadeWords());
+        tellNotMade(m_wait.notMade());
 }
 
 void kyoskNew::stopWaiting() {

@@ -92,6 +92,7 @@ void kyoskNew::openClosingPanel() {
     Label20.text = QString::number(m_choice.basket().SumCopies());
     if (m_state.Optint == OrderKind::Album)
         Txt4Ml2.text = m_state.album.MailZalam;
+    showAddressWord();
     countCoarse();
     Q_EMIT changed();
 }
@@ -135,6 +136,10 @@ void kyoskNew::setDeepCompression(bool deep) {
 // Does not signal: the caller signals once for both panels.
 void kyoskNew::openBranches() {
     Pic4snifim.visible = m_state.coupon.HaKoopon == 1;
+    nameBranches();
+}
+
+void kyoskNew::nameBranches() {
     for (std::size_t branch = 0; branch < Command4Snif.size(); ++branch)
         Command4Snif[branch].text = m_state.profile.Branches[branch].caption;
     // The lab's file names the shops; the name of home delivery is fixed.
@@ -191,10 +196,18 @@ void kyoskNew::closeBranches() {
     Q_EMIT changed();
 }
 
+void kyoskNew::type(Caption& box, const QString& text) {
+    box.text = text;
+    showAddressWord();
+    Q_EMIT changed();
+}
+
 void kyoskNew::typeDomain(const QString& text) {
     Combo1.text = text;
     Combo1Index = -1;
     m_promptStands = false;
+    showAddressWord();
+    Q_EMIT changed();
 }
 
 void kyoskNew::chooseDomain(int index) {
@@ -231,7 +244,7 @@ void kyoskNew::goOnWithoutAddress() {
 
 // The sheet and the log of an album have the address as it is corrected here.
 void kyoskNew::typeAlbumMail(const QString& text) {
-    Txt4Ml2.text = text;
+    type(Txt4Ml2, text);
     m_state.album.MailZalam = text.trimmed();
 }
 

@@ -18,6 +18,8 @@ void kyoskNew::setTexts() {
     if (m_grade != PrintGrade::Unmarked)
         Label6.text = printGradeText(m_grade, m_gradedSize, m_state.english());
     setPaperTexts();
+    nameBranches();
+    showCards();
     if (m_countShown)
         showPictureCount();
     showChoice();
@@ -29,11 +31,11 @@ void kyoskNew::setBrowserTexts() {
     if (plain())
         setCaptions(m_state, {{Title, u"בחירת תמונות", u"Choose your pictures"}});
     else
-        setCaptions(m_state, {{Title, u"לחץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it"}});
+        setCaptions(m_state, {{Title, u"יש ללחוץ על תמונה כדי לערוך אותה", u"Tap a picture to edit it"}});
     setCaptions(
         m_state,
         {
-            {Frame1, u"כאן יוצגו התמונות\nלחץ על הוספת תמונות ובחר תמונה אחת מהתיקייה",
+            {Frame1, u"כאן יוצגו התמונות\nיש ללחוץ על הוספת תמונות ולבחור תמונה אחת מהתיקייה",
              u"Your pictures will show here\nPress Add pictures and select one picture of the folder"},
             {Label7Prompt, u"עותקים", u"Copies"},
             {Label34Prompt, u"תמונות בתיקייה", u"Pictures found"},
@@ -43,6 +45,7 @@ void kyoskNew::setBrowserTexts() {
              u"Turns the view only; the print does not change"},
             {Image5, u"הוסף תמונות", u"Add pictures", u"הוסף תמונות מתיקייה נוספת",
              u"Adds the pictures of a further folder"},
+            {Command4Safa, u"English", u"עברית"},
             {Image6, u"עזרה", u"Help"},
             {Image7, u"סיים ושלח", u"Finish Order And Send"},
             {Image8, u"בטל בחירה בדף זה", u"Cancel this page", u"מבטל את כל התמונות שנבחרו בדף זה",
@@ -70,7 +73,7 @@ void kyoskNew::setBrowserTexts() {
             {helpClose, u"סגור", u"Close"},
             {Picture66, u"שליחת תיקייה שלמה", u"Send a whole folder"},
             {Label35, u"האם לשלוח את כל התיקייה?", u"Send the whole folder?"},
-            {Label36, u"בחר כאן כיצד להמשיך", u"Choose here how to go on"},
+            {Label36, u"יש לבחור כאן כיצד להמשיך", u"Choose here how to go on"},
             {Command24, u"מעוניין לשלוח את כל התיקייה במלואה", u"I want to send the whole folder"},
             {Command25, u"לא את כל התיקייה, אבחר בעצמי", u"Not all of it, I will choose"},
             {Command23, u"התחרטתי רוצה לשלוח תיקייה אחרת ", u"Changed my mind, I want another folder"},
@@ -153,6 +156,7 @@ void kyoskNew::setClosingTexts() {
             {Command21, u"כן להעמיק דחיסה", u"Compress deeper"},
         });
     setCoarseTexts();
+    showAddressWord();
     Combo1.spoken = m_state.wording(u"ספק הדואר, אחרי השטרודל", u"Mail provider, behind the at sign");
     if (m_promptStands)
         Combo1.text = mailDomainPrompt(m_state.english());
@@ -174,6 +178,22 @@ void kyoskNew::showRange() {
                                                           : m_state.wording(u"%1 מתוך %2 שנבחרו", u"%1 of %2 chosen"))
                          .arg(numbers)
                          .arg(range->all);
+}
+
+bool kyoskNew::addressTyped() const {
+    if (addressBox() == AddressBox::AlbumMail)
+        return !Txt4Ml2.text.trimmed().isEmpty();
+    const QString name = Text1.text.trimmed();
+    const bool domain = name.contains(u'@') || (!m_promptStands && !Combo1.text.trimmed().isEmpty());
+    return !name.isEmpty() && domain;
+}
+
+// Nobody is held up by the address: there is always a button to go on without it.
+void kyoskNew::showAddressWord() {
+    if (addressTyped())
+        setCaptions(m_state, {{Label33Word, u"✓ הוקלדה", u"✓ filled in"}});
+    else
+        setCaptions(m_state, {{Label33Word, u"אפשר להמשיך גם בלעדיה", u"you can also go on without it"}});
 }
 
 void kyoskNew::showGuide(Guide guide) {

@@ -287,8 +287,16 @@ void FtpFrm::openOrderFolder() {
     Command12.enabled = false;
     m_platform.shell.copyToClipboard({});
     m_platform.shell.copyToClipboard(m_state.MisparHazmana);
-    if (m_platform.files.folderExists(m_state.transfer.OrderFolder))
-        m_platform.shell.openFolder(m_state.transfer.OrderFolder);
+    const DrivePath& folder = m_state.transfer.OrderFolder;
+    if (m_platform.files.folderExists(folder))
+        m_platform.shell.openFolder(folder, [&state = m_state, &platform = m_platform, folder] {
+            if (state.Careful)
+                platform.dialogs.message(
+                    state
+                        .wording(u"לא ניתן להציג כאן תיקיות. ההזמנה שמורה בתיקייה:\n%1",
+                                 u"Folders can't be shown here. The order is kept in this folder:\n%1")
+                        .arg(folder.text()));
+        });
     Q_EMIT changed();
 }
 

@@ -44,9 +44,11 @@ void hatchalaView::makeHeader() {
     english->setCheckable(true);
     connect(english, &QPushButton::clicked, this, toPage(&hatchala::Check1_Click));
     bind(english, c.Check1);
+    QPushButton* hebrew = button(c.Command4Ivrit, Role::Quiet, &hatchala::Command4Ivrit_Click, u"globe"_s);
+    hebrew->setProperty("letterOfAnyLanguage", true);
     QPushButton* leave = button(c.Image3, Role::Quiet, &hatchala::Image3_MouseDown, u"exit"_s);
     helpFor(leave, hatchala::Hover::Image3);
-    frame().addHeaderActions({english, leave});
+    frame().addHeaderActions({english, hebrew, leave});
 }
 
 QLayout* hatchalaView::makeWords() {

@@ -32,6 +32,13 @@ QString unbrokenSize(const QString& text) {
     return isolated(text).replace(u" / "_s, u"\u00A0/\u00A0"_s);
 }
 
+void changeType(QLabel& label, const char* type) {
+    if (label.property("type").toString() == QLatin1StringView(type))
+        return;
+    label.setProperty("type", QString::fromLatin1(type));
+    label.setStyleSheet(label.styleSheet()); // the look follows the property only when it is set anew
+}
+
 // A long text stands in two lines, broken at the blank nearest to its middle.
 void breakLong(QPushButton& button) {
     QString text = button.text();
@@ -184,9 +191,11 @@ QWidget* kyoskNewView::makeSide() {
 }
 
 void kyoskNewView::makeBars() {
-    frame().addHeaderActions({button(c.Image11, Role::Quiet, &kyoskNew::Image11_Click, u"tag"_s),
-                              button(c.Image6, Role::Quiet, &kyoskNew::Image6_Click, u"info"_s),
-                              button(c.Image10, Role::Quiet, &kyoskNew::Image10_Click, u"exit"_s)});
+    QPushButton* language = button(c.Command4Safa, Role::Quiet, &kyoskNew::Command4Safa_Click, u"globe"_s);
+    language->setProperty("letterOfAnyLanguage", true);
+    frame().addHeaderActions({language, button(c.Image11, Role::Quiet, &kyoskNew::Image11_Click),
+                              button(c.Image6, Role::Quiet, &kyoskNew::Image6_Click),
+                              button(c.Image10, Role::Quiet, &kyoskNew::Image10_Click)});
     frame().addSecondaryActions({button(c.Image5, Role::Secondary, &kyoskNew::Image5_Click, u"folder-plus"_s),
                                  button(c.Image8, Role::Quiet, &kyoskNew::Image8_Click, u"eraser"_s)});
     QPushButton* change = button(c.changeDetails, Role::Quiet, &kyoskNew::changeDetails_Click);
@@ -246,6 +255,7 @@ void kyoskNewView::makeClosingPanel() {
     bind(m_domain, c.Combo1);
     setDomainBox(*m_mail, *m_domain);
     m_at = words("large", u"@"_s);
+    m_addressWord = lineLabel(c.Label33Word, "muted");
     m_albumMail = field(c.Txt4Ml2, toPage(&kyoskNew::Txt4Ml2_Change));
     m_albumMail->setInputMethodHints(Qt::ImhEmailCharactersOnly);
     m_note = field(c.Text2, toPage(&kyoskNew::Text2_Change));
@@ -265,7 +275,7 @@ void kyoskNewView::makeClosingPanel() {
         theme(), this,
         {inRow(Space::Normal, {{label(c.closingHead, "title"), 1}, prices}), facts.frame, coarse.frame,
          inRow(Space::Small, {lineLabel(c.Label4kpn3Prompt, "muted"), lineLabel(c.Label4kpn3, "strong"), Item::room()}),
-         inRow(Space::Small, {label(c.Label17, "strong"), lineLabel(c.Label33, "danger"), Item::room()}),
+         inRow(Space::Small, {label(c.Label17, "strong"), lineLabel(c.Label33, "muted"), m_addressWord, Item::room()}),
          // An address runs from left to right in both languages.
          leftToRight(inRow(Space::Small, {{m_mail, 3}, m_at, {m_domain, 2}, {m_albumMail, 5}})), Space::Tight,
          label(c.Text2Prompt, "strong"), m_note, label(c.LblKoopon, "smallMuted"), Space::Tight,
@@ -365,6 +375,7 @@ void kyoskNewView::renderClosing() {
     m_domain->display(c.Combo1Items, c.Combo1Index, c.Combo1.text, m_page.promptStands() ? Prompt : Choice);
     const AddressBox box = m_page.addressBox();
     m_at->setVisible(box == AddressBox::Mail);
+    changeType(*m_addressWord, m_page.addressTyped() ? "good" : "muted");
     changeRole(m_withoutAddress, box == AddressBox::None ? "main" : "secondary");
     m_closing->setFirstFocus(box == AddressBox::Mail ? m_mail : box == AddressBox::AlbumMail ? m_albumMail : m_note);
     m_closing->setOpen(c.Frame4.visible);

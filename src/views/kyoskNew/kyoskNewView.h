@@ -66,6 +66,7 @@ private:
     Overlay* m_closing = nullptr;
     QLineEdit* m_mail = nullptr;
     QLabel* m_at = nullptr;
+    QLabel* m_addressWord = nullptr;
     EditableCombo* m_domain = nullptr;
     QLineEdit* m_albumMail = nullptr;
     QLineEdit* m_note = nullptr;

@@ -214,7 +214,7 @@ void nnnView::makeHeader() {
     QPushButton* hebrew = button(c.Command4Ivrit, Role::Quiet, &nnn::Command4Ivrit_Click, u"globe"_s);
     hebrew->setProperty("letterOfAnyLanguage", true);
     frame().addHeaderActions({button(c.Image1[EnglishTile], Role::Quiet, &nnn::Image1_Click, EnglishTile, u"globe"_s),
-                              hebrew,
+                              button(c.Command4Anglit, Role::Quiet, &nnn::Command4Anglit_Click, u"globe"_s), hebrew,
                               button(c.Image1[ExitTile], Role::Quiet, &nnn::Image1_Click, ExitTile, u"exit"_s)});
 }
 

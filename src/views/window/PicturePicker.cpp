@@ -2,6 +2,7 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/PictureName.h"
+#include "common/Warning.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Drives.h"
@@ -590,7 +591,9 @@ void PicturePicker::showPicture(const Result<Bitmap>& picture) {
     if (picture) {
         item->setData(PictureRole, picture->image());
     } else {
-        const QString words = failureWords(m_state, picture.failure());
+        writeWarning(picture.failure().message);
+        const HostPath file(item->data(PathRole).toByteArray().toStdString());
+        const QString words = failureWords(m_state, picture.failure(), DrivePath(pathText(file)));
         item->setData(BrokenRole, words);
         item->setData(Qt::AccessibleTextRole, QString(item->text() + u", "_s + words));
     }
