@@ -135,10 +135,10 @@ void kyoskNew::takeFolderOf(const DrivePath& picture) {
     if (File1.count() > 0)
         return;
     const QString none = m_state.door.everyFormat
-                             ? m_state.wording(u"לא נמצאו תמונות בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
+                             ? m_state.wording(u"לא נמצאו תמונות בתיקייה\n%1\nנא לבחור תמונה מתיקייה אחרת",
                                                u"There are no pictures in the folder\n%1\n"
                                                u"Select a picture of another folder")
-                             : m_state.wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nבחר תמונה מתיקייה אחרת",
+                             : m_state.wording(u"לא נמצאו תמונות JPG בתיקייה\n%1\nנא לבחור תמונה מתיקייה אחרת",
                                                u"There are no JPG pictures in the folder\n%1\n"
                                                u"Select a picture of another folder");
     m_platform.dialogs.message(none.arg(folder.text()));

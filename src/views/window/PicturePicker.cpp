@@ -516,13 +516,13 @@ void PicturePicker::open(const HostPath& folder) {
             addPicture(path, false);
     }
     m_empty->setVisible(m_grid->count() == 0);
-    m_empty->setText(m_places.empty() ? m_state.wording(u"הכניסו כרטיס זיכרון או זיכרון נייד למכשיר."_s,
+    m_empty->setText(m_places.empty() ? m_state.wording(u"נא להכניס כרטיס זיכרון או זיכרון נייד למכשיר."_s,
                                                         u"Please put your memory card or stick into the machine."_s)
-                     : error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. בחר מקום אחר."_s,
+                     : error ? m_state.wording(u"אין אפשרות לפתוח תיקייה זו. נא לבחור מקום אחר."_s,
                                                u"This folder can't be opened. Choose another place."_s)
-                     : everyFile() ? m_state.wording(u"אין כאן קבצים. בחר מקום אחר."_s,
+                     : everyFile() ? m_state.wording(u"אין כאן קבצים. נא לבחור מקום אחר."_s,
                                                      u"There are no files here. Choose another place."_s)
-                                   : m_state.wording(u"אין כאן תמונות. בחר מקום אחר."_s,
+                                   : m_state.wording(u"אין כאן תמונות. נא לבחור מקום אחר."_s,
                                                      u"There are no pictures here. Choose another place."_s));
     if (m_grid->count() > 0)
         m_grid->setCurrentRow(m_grid->item(0)->data(HeadingRole).toBool() ? 1 : 0, QItemSelectionModel::NoUpdate);
