@@ -3,19 +3,31 @@
 #include "platform/files/Drives.h"
 
 #include <QClipboard>
+#include <QDeadlineTimer>
 #include <QDesktopServices>
 #include <QGuiApplication>
 #include <QStandardPaths>
 #include <QUrl>
 
+#include <chrono>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-// What was opened stays open behind the program's end.
+namespace {
+
+constexpr std::chrono::seconds opening{10};
+
+} // namespace
+
+// An opener may be the browser itself, which stays open behind the program's end: its process is left alone.
 DesktopShell::~DesktopShell() {
-    for (const std::unique_ptr<QProcess>& opener : m_openers)
+    for (std::unique_ptr<QProcess>& opener : m_openers) {
         opener->disconnect();
+        if (opener->state() != QProcess::NotRunning)
+            static_cast<void>(opener.release());
+    }
 }
 
 void DesktopShell::openWebPage(const QString& url, NotOpened notOpened) {
@@ -44,10 +56,12 @@ void DesktopShell::open(const QUrl& url, const NotOpened& notOpened) {
     opener->setStandardInputFile(QProcess::nullDevice());
     opener->setStandardOutputFile(QProcess::nullDevice());
     opener->setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    QObject::connect(opener.get(), &QProcess::finished, [notOpened](int code, QProcess::ExitStatus) {
-        if (code != 0)
-            notOpened();
-    });
+    // What ends later was open.
+    QObject::connect(opener.get(), &QProcess::finished,
+                     [notOpened, soon = QDeadlineTimer(opening)](int code, QProcess::ExitStatus) {
+                         if (code != 0 && !soon.hasExpired())
+                             notOpened();
+                     });
     QObject::connect(opener.get(), &QProcess::errorOccurred, [notOpened](QProcess::ProcessError error) {
         if (error == QProcess::FailedToStart)
             notOpened();

@@ -37,6 +37,11 @@ QString MailAddressGuard::address(const TypedAddress& typed) const {
     return name.isEmpty() || isWhole(name) || domain.isEmpty() ? name : name + u'@' + domain;
 }
 
+bool MailAddressGuard::isComplete(const TypedAddress& typed) {
+    const QString name = nameIn(typed);
+    return isWhole(name) || (!name.isEmpty() && !name.contains(u'@') && !domainIn(typed).isEmpty());
+}
+
 bool MailAddressGuard::lacksDomain(const TypedAddress& typed) const {
     const QString name = nameIn(typed);
     return m_state.Careful && !name.isEmpty() && !isWhole(name) && domainIn(typed).isEmpty();

@@ -21,6 +21,8 @@ public:
 
     // A whole address in the first box is taken as it is. Empty where nothing was typed.
     QString address(const TypedAddress& typed) const;
+    // What was typed is an address, by either box.
+    static bool isComplete(const TypedAddress& typed);
     // The customer is asked for the domain.
     bool lacksDomain(const TypedAddress& typed) const;
     // The domain that was chosen stays when its boxes are opened again.

@@ -27,8 +27,8 @@ bool waitsForAnswer(const SessionState& state, const Files& files, const Unfinis
 
 } // namespace
 
-QList<WaitingOrder> OrdersThatWait(const SessionState& state, const Platform& platform) {
-    QList<WaitingOrder> waiting;
+QList<CountedOrder> OrdersThatWait(const SessionState& state, const Platform& platform) {
+    QList<CountedOrder> waiting;
     if ((!state.Waiting && !state.kiosk.on) || platform.instances.another())
         return waiting;
     for (const UnfinishedOrder& order : UnfinishedOrders(state, platform.files)) {
@@ -46,7 +46,7 @@ QList<WaitingOrder> OrdersThatWait(const SessionState& state, const Platform& pl
 void WaitingOrders::refresh() {
     m_orders = OrdersThatWait(m_state, m_platform);
     QHash<QString, Moment> due;
-    for (const WaitingOrder& waiting : m_orders) {
+    for (const CountedOrder& waiting : m_orders) {
         const OrderFolder& folder = waiting.order.folder;
         due[folder.name()] =
             m_due.contains(folder.name()) ? m_due[folder.name()] : afterPause(waiting.order.state.tries);
@@ -56,7 +56,7 @@ void WaitingOrders::refresh() {
 
 std::optional<UnfinishedOrder> WaitingOrders::due() const {
     const Moment now = m_platform.clock.running();
-    for (const WaitingOrder& waiting : m_orders) {
+    for (const CountedOrder& waiting : m_orders) {
         if (waiting.byItself && m_due.value(waiting.order.folder.name()) <= now)
             return waiting.order;
     }

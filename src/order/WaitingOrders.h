@@ -11,16 +11,15 @@ namespace lumora {
 
 struct Platform;
 
-struct WaitingOrder {
+struct CountedOrder {
     UnfinishedOrder order;
     bool byItself = true; // is sent by itself; else the staff sends it
 };
 
-// The orders that the staff counts, oldest first: those whose sending can go on, but for one that the staff has given
-// up. By itself none is sent where the lab has not switched it on, nor one that waits for an answer about pictures that
-// were left out; such a one is told on a kiosk, once its customer was waited for in vain. None where another program
-// runs in the data folder.
-QList<WaitingOrder> OrdersThatWait(const SessionState& state, const Platform& platform);
+// The orders whose sending can go on, oldest first, but for one that the staff has given up. One that waits for an
+// answer about pictures that were left out is not sent by itself; it is counted on a kiosk once it has lapsed. None
+// where another program runs in the data folder.
+QList<CountedOrder> OrdersThatWait(const SessionState& state, const Platform& platform);
 
 // Which of the orders that wait is sent next, and when. Each pauses by the count of its tries, which its state keeps;
 // behind a start of the program each begins with a pause, so that an order that ends the program leaves it free.
@@ -45,7 +44,7 @@ private:
 
     const SessionState& m_state;
     const Platform& m_platform;
-    QList<WaitingOrder> m_orders;
+    QList<CountedOrder> m_orders;
     QHash<QString, Moment> m_due; // by the name of the folder
 };
 

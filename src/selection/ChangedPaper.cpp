@@ -59,7 +59,8 @@ QString RecordOnPaper(const QString& record, std::optional<PictureSize> picture,
 
 bool ChangesPrints(const OrderDetails& before, const OrderDetails& now) {
     return before.Bord != now.Bord || before.ppr != now.ppr || before.FillFit != now.FillFit ||
-           before.maat != now.maat || sizeField(before) != sizeField(now);
+           paperLetter(before.maat, PaperWords::All, u' ') != paperLetter(now.maat, PaperWords::All, u' ') ||
+           sizeField(before) != sizeField(now);
 }
 
 } // namespace lumora

@@ -51,8 +51,11 @@ std::optional<PictureChoice::Range> PictureChoice::range() const {
     if (!m_inView || m_page.isEmpty())
         return std::nullopt;
     const int shown = m_page.count();
-    const int all = m_inView->of == SeenPages::Of::Folders ? m_folders.count() : m_basket.count();
-    return Range{m_inView->of, m_inView->start, shown, std::max(all, m_inView->start + shown)};
+    if (m_inView->of == SeenPages::Of::Folders)
+        return Range{m_inView->of, m_inView->start, shown, std::max(m_folders.count(), m_inView->start + shown)};
+    if (std::find(m_copies.begin(), m_copies.begin() + shown, 0) != m_copies.begin() + shown)
+        return std::nullopt; // one of the page is chosen no more
+    return Range{m_inView->of, m_inView->start, shown, m_basket.count()};
 }
 
 void PictureChoice::readFolderPage() {

@@ -34,11 +34,6 @@ Page& PageChain::load(PageId id) {
     return page;
 }
 
-void PageChain::setTexts() {
-    for (const auto& [id, page] : m_pages)
-        page->setTexts();
-}
-
 bool PageChain::show(PageId id) {
     if (hasEnded() || !isRegistered(id))
         return false;

@@ -24,8 +24,6 @@ public:
 
     void registerPage(PageId id, Maker maker);
 
-    // The session goes on in the other language: every page that is loaded sets its texts anew.
-    void setTexts();
     // The page with this id, made and loaded if it does not exist yet, without bringing it to the front. A service page
     // such as gdisave is used this way.
     Page& load(PageId id);

@@ -18,7 +18,9 @@ void WebPages::open(const QString& url) const {
 }
 
 void WebPages::tellNotOpened(const QString& url) const {
-    QString text = m_state.wording(u"לא ניתן להציג כאן דפי אינטרנט.", u"Web pages can't be shown here.");
+    QString text = url.trimmed().isEmpty()
+                       ? m_state.wording(u"לדף זה לא הוגדרה כתובת.", u"No address is set for this page.")
+                       : m_state.wording(u"לא ניתן להציג כאן דפי אינטרנט.", u"Web pages can't be shown here.");
     if (!url.trimmed().isEmpty())
         text += u'\n' +
                 m_state.wording(u"אפשר לפתוח את הדף במכשיר אחר: %1", u"You can open this page on another device: %1")

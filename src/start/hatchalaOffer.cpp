@@ -63,9 +63,9 @@ void hatchala::readUnfinished() {
         m_unfinished = OfferedOnKiosk(m_unfinished, m_platform.files);
     if (!m_state.Waiting)
         return;
-    const QList<WaitingOrder> waiting = OrdersThatWait(m_state, m_platform);
+    const QList<CountedOrder> waiting = OrdersThatWait(m_state, m_platform);
     m_unfinished.removeIf([&](const UnfinishedOrder& order) {
-        return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const WaitingOrder& other) {
+        return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const CountedOrder& other) {
                    return other.byItself && other.order.folder.path() == order.folder.path();
                });
     });

@@ -39,16 +39,19 @@ TEST(MailAddressGuard, TakesAWholeAddressAsItIsAndNeverThePrompt) {
         TypedAddress typed;
         QString builtIn, careful;
         bool asks;
+        bool complete = false;
     } cases[] = {
-        {{u"dana"_s, u"example.com"_s}, u"dana@example.com"_s, u"dana@example.com"_s, false},
-        {{u" d@lab.example"_s, u"gmail.com"_s}, u" d@lab.example@gmail.com"_s, u"d@lab.example"_s, false},
-        {{u"dana@"_s, u"@example.com"_s}, u"dana@@@example.com"_s, u"dana@example.com"_s, false},
+        {{u"dana"_s, u"example.com"_s}, u"dana@example.com"_s, u"dana@example.com"_s, false, true},
+        {{u" d@lab.example"_s, u"gmail.com"_s}, u" d@lab.example@gmail.com"_s, u"d@lab.example"_s, false, true},
+        {{u"dana@"_s, u"@example.com"_s}, u"dana@@@example.com"_s, u"dana@example.com"_s, false, true},
+        {{u"dana@"_s, u"@"_s}, u"dana@@@"_s, u"dana"_s, true},
         {prompt, u"dana@Choose or type"_s, u"dana"_s, true},
         {{{}, u"Choose or type"_s, true}, u"@Choose or type"_s, {}, false},
         {{{}, u"gmail.com"_s}, u"@gmail.com"_s, {}, false},
     };
     SessionState state;
     for (const auto& c : cases) {
+        EXPECT_EQ(MailAddressGuard::isComplete(c.typed), c.complete) << c.builtIn.toStdString();
         for (const bool careful : {false, true}) {
             state.Careful = careful;
             EXPECT_EQ(MailAddressGuard(state).address(c.typed), careful ? c.careful : c.builtIn);

@@ -170,7 +170,7 @@ TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
         session.Careful = careful;
         session.kiosk.on = kiosk;
         QString numbers;
-        for (const WaitingOrder& one : OrdersThatWait(session, test.platform))
+        for (const CountedOrder& one : OrdersThatWait(session, test.platform))
             numbers += one.order.folder.name().last(3) + QLatin1StringView(one.byItself ? " " : "? ");
         return numbers.toStdString();
     };

@@ -16,7 +16,9 @@
 #include <QScrollBar>
 #include <QScroller>
 #include <QTest>
+#include <QTouchEvent>
 #include <QWheelEvent>
+#include <QWindow>
 
 #include <gtest/gtest.h>
 
@@ -33,7 +35,9 @@ public:
         : m_walk(walk) {
         walk.activate();
     }
-    void draw(QWidget& on, const std::vector<QPoint>& way, const std::vector<QPoint>& second = {}) {
+    enum class End { Lifted, Cancelled };
+    void draw(QWidget& on, const std::vector<QPoint>& way, const std::vector<QPoint>& second = {},
+              End end = End::Lifted) {
         m_walk.settle();
         auto hand = QTest::touchEvent(on.window(), m_device.get(), false);
         hand.press(0, way.front(), &on).commit();
@@ -47,6 +51,10 @@ public:
                 hand.release(1, second.back(), &on);
             hand.commit();
             QTest::qWait(20); // what scrolls follows by the frames of the screen
+        }
+        if (end == End::Cancelled) {
+            QTouchEvent cancelled(QEvent::TouchCancel, m_device.get());
+            QApplication::sendEvent(on.window()->windowHandle(), &cancelled);
         }
         hand.release(0, way.back(), &on).commit();
         m_walk.settle();
@@ -174,7 +182,11 @@ TEST(Fingers, ZoomAndTurnThePictureByTheStepsOfItsButtons) {
         fingers.draw(paper, one, other);
     };
     const int panX = edit.PanX;
-    pinch({{100, 0}, {125, 45}, {150, 90}});
+    fingers.draw(paper, {middle, middle}, {middle + QPoint(100, 0), middle + QPoint(120, 0)}, Fingers::End::Cancelled);
+    EXPECT_EQ(record(15), 120);
+    pinch({{100, 0}, {100, 0}});
+    EXPECT_EQ(record(15), 120) << "the pinch before has ended";
+    pinch({{120, 0}, {135, 45}, {150, 90}});
     EXPECT_EQ(record(15), 150);
     EXPECT_EQ(record(12), 180) << "the panel of the turns is closed";
     EXPECT_EQ(edit.PanX, panX) << "the finger that stays drags nothing";

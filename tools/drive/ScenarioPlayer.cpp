@@ -103,7 +103,7 @@ void ScenarioPlayer::step() {
         ++m_file;
         m_command = 0;
     }
-    if (m_finished || m_held || m_pressAgain.isActive())
+    if (m_finished || m_held)
         return;
     const bool busy = m_program.platform().pump.pumping();
     if (m_file == m_files.size()) {
@@ -111,7 +111,7 @@ void ScenarioPlayer::step() {
             finish();
         return;
     }
-    if (m_program.chain().goesToStart())
+    if (m_program.chain().goesToStart() && m_atThisLine.elapsed() < patienceOfWork * 1000)
         return;
     if (m_program.chain().hasEnded())
         return fail(place(), u"a running program"_s, u"it has ended"_s);
@@ -122,8 +122,11 @@ void ScenarioPlayer::step() {
             fail(place(), u"the end of the work before this line"_s, u"work without end"_s);
         return;
     }
-    if (touches(command.verb))
-        return touch(command);
+    if (touches(command.verb)) {
+        if (!m_pressAgain.isActive())
+            touch(command);
+        return;
+    }
 
     m_program.window().renderNow();
     const Look seen = look(command);

@@ -101,7 +101,7 @@ void nnn::takeTile(int tile) {
 
 void nnn::turnTo(Language language) {
     m_state.EnglishTips = language == Language::English ? 1 : 0;
-    setTexts();
+    m_chain.setAllTexts(); // also of the pages that wait for this one
 }
 
 // Does what all tiles have in common. False when the workspace could not be made; the customer has been told.

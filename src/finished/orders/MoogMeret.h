@@ -53,7 +53,7 @@ struct MoogMeretControls : Controls {
     Caption Label7{*this, u"Label7"};
     Caption Label4Lakoach{*this, u"Label4Lakoach"}; // the customer named in the order's log
 
-    Caption waitingPanel; // orders that are sent by themselves, beside the hint
+    Caption waitingPanel; // orders that are not sent yet, beside the hint
     Caption Label4Mamtinot{*this, u"Label4Mamtinot"};
     TextList List4Mamtinot{*this, u"List4Mamtinot"}; // oldest first
     Caption Command4Nase{*this, u"Command4Nase"};    // sends the chosen one now
@@ -217,7 +217,7 @@ private:
     bool asksToThrowAway(const QString& number);
     bool asksToGiveUp(const QString& number);
     void tellNotGivenUp(const Failure& failure);
-    QString waitingRow(const WaitingOrder& waiting) const;
+    QString waitingRow(const CountedOrder& waiting) const;
     bool asks(const char16_t* hebrew, const char16_t* english, const QStringList& numbers = {});
 
     void sendByMail();
@@ -246,7 +246,7 @@ private:
     FilesToSend m_files;
     QStringList m_notFinished; // names of the listed orders whose preparation did not come to its end
     QStringList m_givenUp;     // and of those that the staff has given up
-    QList<WaitingOrder> m_waiting;
+    QList<CountedOrder> m_waiting;
     PackageWalk m_walk;
     bool m_walksWholeOrder = false; // all prints of the order are among the packages
     Ticker Timer3;

@@ -72,7 +72,7 @@ MoogMeret::OrderRow MoogMeret::orderRow(const QString& folderName) const {
     return row;
 }
 
-QString MoogMeret::waitingRow(const WaitingOrder& waiting) const {
+QString MoogMeret::waitingRow(const CountedOrder& waiting) const {
     const UnfinishedOrder& order = waiting.order;
     const OrderDetails details = detailsOf(order.folder.path());
     const QString tries = m_state.wording(u"ניסיונות: %1, גודל: %2 מ\"ב"_s, u"tries: %1, size: %2 MB"_s)

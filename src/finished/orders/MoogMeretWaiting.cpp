@@ -1,4 +1,4 @@
-// The orders that are sent by themselves, on the page of finished orders.
+// The orders that are not sent yet, on the page of finished orders.
 #include "finished/orders/MoogMeret.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
@@ -12,9 +12,9 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 void MoogMeret::listWaiting() {
-    m_waiting = m_state.mayOpenOperatorArea() ? OrdersThatWait(m_state, m_platform) : QList<WaitingOrder>();
+    m_waiting = m_state.mayOpenOperatorArea() ? OrdersThatWait(m_state, m_platform) : QList<CountedOrder>();
     List4Mamtinot.clear();
-    for (const WaitingOrder& waiting : std::as_const(m_waiting))
+    for (const CountedOrder& waiting : std::as_const(m_waiting))
         List4Mamtinot.append(waitingRow(waiting));
     waitingPanel.visible = !List4Mamtinot.isEmpty();
     chooseWaiting(-1);

@@ -184,7 +184,7 @@ void kyoskNew::turnHelp() {
 
 void kyoskNew::turnLanguage() {
     m_state.EnglishTips = m_state.english() ? 0 : 1;
-    m_chain.setTexts(); // also of the editor, which is loaded behind this page
+    m_chain.setAllTexts(); // also of the editor, which is loaded behind this page
 }
 
 void kyoskNew::openPriceList() {

@@ -1,4 +1,5 @@
 // All texts of the page of pictures, in both languages.
+#include "order/MailAddressGuard.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/CaptionTexts.h"
 #include "session/SessionState.h"
@@ -183,17 +184,15 @@ void kyoskNew::showRange() {
 bool kyoskNew::addressTyped() const {
     if (addressBox() == AddressBox::AlbumMail)
         return !Txt4Ml2.text.trimmed().isEmpty();
-    const QString name = Text1.text.trimmed();
-    const bool domain = name.contains(u'@') || (!m_promptStands && !Combo1.text.trimmed().isEmpty());
-    return !name.isEmpty() && domain;
+    return MailAddressGuard::isComplete(typedAddress());
 }
 
 // Nobody is held up by the address: there is always a button to go on without it.
 void kyoskNew::showAddressWord() {
     if (addressTyped())
-        setCaptions(m_state, {{Label33Word, u"✓ הוקלדה", u"✓ filled in"}});
+        setCaptions(m_state, {{Label33Word, u"✓ הוקלד", u"✓ filled in"}});
     else
-        setCaptions(m_state, {{Label33Word, u"אפשר להמשיך גם בלעדיה", u"you can also go on without it"}});
+        setCaptions(m_state, {{Label33Word, u"אפשר להמשיך גם בלעדיו", u"you can also go on without it"}});
 }
 
 void kyoskNew::showGuide(Guide guide) {

@@ -115,6 +115,10 @@ QString SendingPage::adviceOf(const PhaseLook& row) const {
         return wording(answerAwaitedAdvice);
     if (row.phase == SendingPhase::Success && m_state.Careful && report().isEndUnknown())
         return wording(untoldAdvice);
+    if (!mayBeClosed() && row.phase == SendingPhase::Sending)
+        return wording(kioskSendingAdvice);
+    if (!mayBeClosed() && row.phase == SendingPhase::Refused)
+        return wording(kioskRefusedAdvice);
     if (goesOnByItself(row.phase)) {
         const QString phone = m_state.profile.LabPhone.trimmed();
         return wording(goesOnByItselfAdvice) + (phone.isEmpty() ? phone : wording(labPhoneAdvice).arg(phone));
@@ -137,8 +141,8 @@ bool SendingPage::mayBeClosed() const {
 bool SendingPage::goesOnByItself(SendingPhase phase) const {
     if (phase != SendingPhase::NotAll && phase != SendingPhase::Unclear && phase != SendingPhase::Stopped)
         return false;
-    const QList<WaitingOrder> waiting = OrdersThatWait(m_state, m_platform);
-    return std::any_of(waiting.begin(), waiting.end(), [this](const WaitingOrder& one) {
+    const QList<CountedOrder> waiting = OrdersThatWait(m_state, m_platform);
+    return std::any_of(waiting.begin(), waiting.end(), [this](const CountedOrder& one) {
         return one.byItself && one.order.folder.path() == m_state.transfer.OrderFolder;
     });
 }
@@ -204,6 +208,8 @@ void SendingPage::tellPhase() {
     m_leftOut.show();
     m_shown.Label4Order.text = wording(u"ההזמנה שלכם", u"Your order");
     m_shown.Command28.visible = row.buttons.testFlag(SendingButton::NewOrder);
+    m_shown.Image3.text = mayBeClosed() ? wording(u"סגור", u"Close") : wording(toFirstPageWords);
+    m_shown.Image3.visible = mayBeClosed() || !m_shown.Command28.visible; // a new order begins on the first page
     m_shown.changeOrder.text = wording(changeWords);
     m_shown.changeOrder.visible = row.buttons.testFlag(SendingButton::Change) && mayChange();
     showReporting();

@@ -33,7 +33,12 @@ inline constexpr SendingWords sentAdvice{u"כל ההזמנה הגיעה. אפש�
                                          u"The whole order has arrived. You can close, or begin a new order."};
 inline constexpr SendingWords partSentAdvice{u"מה שבהזמנה הגיע. אפשר לסגור או להתחיל הזמנה חדשה.",
                                              u"What is in the order has arrived. You can close, or begin a new order."};
-// A kiosk is closed by nobody.
+// A kiosk is closed by nobody, and its finished orders are the staff's.
+inline constexpr SendingWords toFirstPageWords{u"לדף הפתיחה", u"To the first page"};
+inline constexpr SendingWords kioskSendingAdvice{u"ההזמנה נשלחת. נא להמתין.", u"The order is being sent. Please wait."};
+inline constexpr SendingWords kioskRefusedAdvice{
+    u"לא נשלח דבר. ההזמנה שמורה במחשב זה. יש לפנות לצוות החנות.",
+    u"Nothing was sent. The order is kept on this computer. Please tell the staff of the shop."};
 inline constexpr SendingWords kioskSentAdvice{u"כל ההזמנה הגיעה. אפשר להתחיל הזמנה חדשה.",
                                               u"The whole order has arrived. You can begin a new order."};
 inline constexpr SendingWords kioskPartSentAdvice{u"מה שבהזמנה הגיע. אפשר להתחיל הזמנה חדשה.",
@@ -80,10 +85,10 @@ inline constexpr SendingWords fewerReportingWords{u"ההזמנה הגיעה. מ�
                                                   u"Your order has arrived. Telling the shop, please wait."};
 // %1: prints that have arrived, %2: prints that the order's log names.
 inline constexpr SendingWords fewerToldWords{
-    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרת, והמעבדה קיבלה על כך הודעה.",
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרתם, והמעבדה קיבלה על כך הודעה.",
     u"%1 of the %2 pictures in the order's log have arrived, as you agreed, and the lab was told."};
 inline constexpr SendingWords fewerArrivedWords{
-    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרת.",
+    u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, כפי שאישרתם.",
     u"%1 of the %2 pictures in the order's log have arrived, as you agreed."};
 inline constexpr SendingWords fewerUntoldWords{
     u"הגיעו %1 מתוך %2 התמונות שברישום ההזמנה, והמעבדה לא קיבלה על כך הודעה. יש להתקשר למעבדה.",

@@ -290,7 +290,7 @@ void FtpFrm::openOrderFolder() {
     const DrivePath& folder = m_state.transfer.OrderFolder;
     if (m_platform.files.folderExists(folder))
         m_platform.shell.openFolder(folder, [&state = m_state, &platform = m_platform, folder] {
-            if (state.Careful)
+            if ((state.Careful || state.kiosk.on) && !state.closedToCustomers())
                 platform.dialogs.message(
                     state
                         .wording(u"לא ניתן להציג כאן תיקיות. ההזמנה שמורה בתיקייה:\n%1",

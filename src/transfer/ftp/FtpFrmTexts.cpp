@@ -142,7 +142,6 @@ void FtpFrm::showMinutes() {
 
 void FtpFrm::setTexts() {
     Command24.visible = m_state.mayOpenOperatorArea();
-    Image3.visible = mayBeClosed();
     if (m_state.kiosk.on)
         Image4.visible = m_state.staff && phase() != SendingPhase::Success;
     setCaptions(
@@ -160,7 +159,6 @@ void FtpFrm::setTexts() {
          {Command22, u"במקרה של תקלה בתקשורת לחץ כאן", u"In case of a communication fault press here"},
          {Command24, u"הצג יותר פרטים", u"Show more details"},
          {Command9, u"הסתר פרטים", u"Hide details"},
-         {Image3, u"סגור", u"Close"},
          {Image4, u"פתח את תיקיית ההזמנה", u"Open the order folder"},
          {Image5, u"שלח עכשיו", u"Send now"},
          {Command27, u"Copy"},
@@ -179,6 +177,10 @@ void FtpFrm::setTexts() {
           u"Please note!\rThe pictures have not been sent yet.\rIf you close the program now,\rperhaps not all "
           u"pictures "
           u"will be printed."}});
+    if (!mayBeClosed())
+        setCaptions(m_state, {{Command14, u"להישאר כאן", u"Stay here"},
+                              {Command16, u"לחזור לדף הפתיחה בלי לשלוח", u"Back to the first page without sending"},
+                              {Picture7, u"התמונות עדיין לא נשלחו.", u"The pictures have not been sent yet."}});
     setLabTexts();
     showCounts();
     tellPhase();

@@ -151,14 +151,12 @@ void UploadForm::showAnswers() {
 
 void UploadForm::setTexts() {
     Command24.visible = m_state.mayOpenOperatorArea();
-    Image3.visible = mayBeClosed();
     setCaptions(m_state, {{Command2, u"רענן רשימה", u"Refresh list"},
                           {Command3, u"עצור את המשלוח", u"Stop the sending"},
                           {Command10, u"המשך את המשלוח", u"Continue the sending"},
                           {Command15, u"עצור", u"Stop"},
                           {sendNow, u"שלח עכשיו", u"Send now"},
                           {Command28, u"הזמנה חדשה", u"New order"},
-                          {Image3, u"סגור", u"Close"},
                           {endClose, u"סגור", u"Close"},
                           {Image5, u"שלח שוב", u"Send again"},
                           {Label9, u"שולח", u"Sending"},

@@ -49,6 +49,12 @@ QAbstractScrollArea* scrolledAround(QWidget* widget) {
     return area;
 }
 
+// No panel has come to lie over it.
+bool isInSight(const QWidget& widget) {
+    const QWidget* hit = widget.window()->childAt(widget.mapTo(widget.window(), widget.rect().center()));
+    return hit && (hit == &widget || widget.isAncestorOf(hit));
+}
+
 PinchTarget* targetAt(QWindow& window, QPointF at) {
     QWidget* whole = QWidget::find(window.winId());
     return whole ? around<PinchTarget>(whole->childAt(whole->mapFromGlobal(at.toPoint()))) : nullptr;
@@ -85,7 +91,7 @@ bool FingerMoves::eventFilter(QObject* watched, QEvent* event) {
         return false;
     case QEvent::TouchCancel:
         if (watched->isWindowType())
-            forget();
+            forget(Way::Spent); // its release still comes
         return false;
     case QEvent::Polish: // before anything is pressed, since rows move by it
         if (auto* rows = qobject_cast<QAbstractItemView*>(watched)) {
@@ -102,7 +108,9 @@ bool FingerMoves::eventFilter(QObject* watched, QEvent* event) {
         return false;
     }
     const auto& mouse = static_cast<const QMouseEvent&>(*event);
-    if (m_sends || !watched->isWidgetType() || !isTouch(mouse))
+    // What a press of ours starts may run an event loop, whose fingers are others.
+    const bool ours = m_sends && !event->spontaneous();
+    if (ours || !watched->isWidgetType() || !isTouch(mouse))
         return false;
     switch (event->type()) {
     case QEvent::MouseMove:
@@ -120,6 +128,7 @@ bool FingerMoves::press(QWidget& widget, const QMouseEvent& event) {
         m_way = Way::Open;
         m_widget = &widget;
         m_from = m_at = event.globalPosition();
+        m_finger = event.pointingDevice();
         m_area = scrolledAround(&widget);
         m_box = around<SwipeBox>(&widget);
         if (m_box)
@@ -164,35 +173,39 @@ bool FingerMoves::release(const QMouseEvent& event) {
     auto swipe = std::exchange(m_swipe, std::nullopt);
     if (way == Way::Open) {
         sendPress();
-        return false;
+        return !m_widget; // it may have gone with its press
     }
-    if (way == Way::Spent && swipe && m_box)
+    if (way == Way::Spent && swipe && m_box && isInSight(*m_box))
         m_box->swipe(swipe->end(event.globalPosition(), static_cast<qint64>(event.timestamp())));
     return true;
 }
 
-void FingerMoves::sendPress() {
+void FingerMoves::send(QMouseEvent& event) {
     m_sends = true;
+    QApplication::sendEvent(m_widget, &event);
+    m_sends = false;
+}
+
+void FingerMoves::sendPress() {
     for (const auto& waiting : std::exchange(m_waiting, {})) {
         if (m_widget)
-            QApplication::sendEvent(m_widget, waiting.get());
+            send(*waiting);
     }
-    m_sends = false;
 }
 
 // The press is taken back from what has it.
 void FingerMoves::begin(Way way) {
     const bool pressed = m_way == Way::Open && !m_waits;
+    if (m_area && way != Way::Scrolls)
+        QScroller::scroller(m_area->viewport())->stop();
     m_way = way;
     m_waiting.clear();
     m_rests.stop();
     if (!pressed || !m_widget)
         return;
-    m_sends = true;
     QMouseEvent away(QEvent::MouseButtonRelease, {farAway, farAway}, {farAway, farAway}, Qt::LeftButton, Qt::NoButton,
-                     Qt::NoModifier);
-    QApplication::sendEvent(m_widget, &away);
-    m_sends = false;
+                     Qt::NoModifier, m_finger);
+    send(away);
 }
 
 void FingerMoves::scroll(int input, const QMouseEvent& event) const {
@@ -213,15 +226,13 @@ void FingerMoves::follow(QWindow& window, const QTouchEvent& event) {
             down.push_back(point.globalPosition());
     }
     if (event.type() == QEvent::TouchBegin && m_way != Way::None)
-        forget(); // the finger before was lifted where nobody was told
-    if (event.type() == QEvent::TouchBegin) {
+        forget(Way::None);
+    if (event.type() == QEvent::TouchBegin && !down.empty()) {
         if (auto* target = targetAt(window, down.front()))
             target->touched();
     }
     if (m_pinch && down.size() != 2) {
-        m_pinch.reset();
-        if (auto* target = dynamic_cast<PinchTarget*>(m_pinched.data()))
-            target->pinchEnded();
+        endPinch();
     } else if (m_pinch) {
         m_pinch->follow({down[0], down[1]});
         if (auto* target = dynamic_cast<PinchTarget*>(m_pinched.data()))
@@ -240,10 +251,19 @@ void FingerMoves::beginPinch(QWindow& window, QLineF fingers) {
     m_pinch.emplace(fingers);
 }
 
-void FingerMoves::forget() {
-    begin(Way::None);
+void FingerMoves::endPinch() {
+    if (!std::exchange(m_pinch, std::nullopt))
+        return;
+    if (auto* target = dynamic_cast<PinchTarget*>(m_pinched.data()))
+        target->pinchEnded();
+}
+
+// The finger was lifted where nobody was told.
+void FingerMoves::forget(Way way) {
+    if (m_way != Way::None)
+        begin(way);
     m_swipe.reset();
-    m_pinch.reset();
+    endPinch();
 }
 
 void FingerMoves::tell() const {

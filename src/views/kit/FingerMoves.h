@@ -15,6 +15,7 @@
 #include <vector>
 
 class QAbstractScrollArea;
+class QPointingDevice;
 class QTouchEvent;
 class QWindow;
 
@@ -66,8 +67,10 @@ private:
     void beginPinch(QWindow& window, QLineF fingers);
     void begin(Way way);
     void scroll(int input, const QMouseEvent& event) const;
+    void send(QMouseEvent& event);
     void sendPress();
-    void forget();
+    void endPinch();
+    void forget(Way way);
     void tell() const;
 
     Way m_way = Way::None;
@@ -80,6 +83,7 @@ private:
     bool m_waits = false;
     bool m_sends = false;
     QPointF m_from;
+    const QPointingDevice* m_finger = nullptr;
     QPointF m_at;
     QPointer<QWidget> m_pinched;
     std::optional<Pinch> m_pinch;

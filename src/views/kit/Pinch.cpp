@@ -17,7 +17,7 @@ void Pinch::follow(QLineF fingers) {
 }
 
 double Pinch::times() const {
-    return m_last.length() / std::max(closest, m_first.length());
+    return std::max(closest, m_last.length()) / std::max(closest, m_first.length());
 }
 
 } // namespace lumora

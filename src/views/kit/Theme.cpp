@@ -167,12 +167,12 @@ QString Theme::styleSheet() const {
                                                       {u"VioletSoft"_s, Colour::VioletSoft}};
     // Less the border of two pixels that the style adds.
     const std::map<QString, int> sizes = {
-        {u"target"_s, target() - 2}, {u"key"_s, key() - 2}, {u"halfKey"_s, key() / 2}};
+        {u"target"_s, target() - 2}, {u"row"_s, target()}, {u"key"_s, key() - 2}, {u"halfKey"_s, key() / 2}};
     QFile file(u":/theme.qss"_s);
     if (!file.open(QIODevice::ReadOnly))
         return {};
     const QString sheet = QString::fromUtf8(file.readAll());
-    static const QRegularExpression placeholder(u"@(\\d+)|\\$(target|halfKey|key|[A-Z]\\w+)"_s);
+    static const QRegularExpression placeholder(u"@(\\d+)|\\$(target|row|halfKey|key|[A-Z]\\w+)"_s);
     QString result;
     qsizetype from = 0;
     for (auto it = placeholder.globalMatch(sheet); it.hasNext();) {
