@@ -373,7 +373,7 @@ TEST_F(ThePictures, areHandedOverOnceWithAddressAndNote) {
     page.Image7_Click();
     EXPECT_EQ(page.controls().Label19.text + page.controls().Label20.text, u"10/153"_s);
     page.Text1_Change(u"dana"_s);
-    EXPECT_EQ(page.controls().Label33Word.text, u"אפשר להמשיך גם בלעדיה"_s) << "half an address";
+    EXPECT_EQ(page.controls().Label33Word.text, u"אפשר להמשיך גם בלעדיו"_s) << "half an address";
     page.Combo1_Change(u"example.com"_s);
     page.Text2_Change(u"gift"_s);
     page.Command4Safa_Click(); // to English, with all that was chosen and typed
