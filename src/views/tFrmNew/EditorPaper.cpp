@@ -12,7 +12,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr QColor table{0x2C, 0x31, 0x36};
+constexpr QColor tableColour{0x2C, 0x31, 0x36};
 constexpr QColor words{0xE9, 0xEA, 0xEB};
 constexpr double handleRadius = 18; // of a crop handle, in logical pixels
 
@@ -251,7 +251,7 @@ void EditorTable::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
-    painter.setBrush(table);
+    painter.setBrush(tableColour);
     painter.drawRoundedRect(rect(), m_theme.corner(), m_theme.corner());
     if (m_paper->isVisible()) {
         const QRectF paper = m_paper->geometry();
