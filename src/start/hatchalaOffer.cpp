@@ -51,19 +51,20 @@ void hatchala::offerUnfinished() {
     if (anotherRuns())
         return;
     TidyOrders(m_state, m_platform.files);
-    if (!m_state.offerPutOff)
-        readUnfinished();
-    m_state.waitingOrders = static_cast<int>(OrdersThatWait(m_state, m_platform).size());
+    readUnfinished();
 }
 
 // What is sent by itself is no business of the next customer.
 void hatchala::readUnfinished() {
+    const QList<CountedOrder> waiting = OrdersThatWait(m_state, m_platform);
+    m_state.waitingOrders = static_cast<int>(waiting.size());
+    if (m_state.offerPutOff)
+        return;
     m_unfinished = UnfinishedOrders(m_state, m_platform.files);
     if (m_state.closedToCustomers())
         m_unfinished = OfferedOnKiosk(m_unfinished, m_platform.files);
     if (!m_state.Waiting)
         return;
-    const QList<CountedOrder> waiting = OrdersThatWait(m_state, m_platform);
     m_unfinished.removeIf([&](const UnfinishedOrder& order) {
         return order.state.givenUp || std::any_of(waiting.begin(), waiting.end(), [&](const CountedOrder& other) {
                    return other.byItself && other.order.folder.path() == order.folder.path();

@@ -70,17 +70,7 @@ struct NobodyIsThere : ::testing::Test, PageRig {
     }
 
     WaitingDialogs dialogs;
-    Platform platform{machine.files,
-                      dialogs,
-                      machine.noInternet,
-                      machine.mail,
-                      machine.shell,
-                      machine.clock,
-                      machine.pump,
-                      machine.volume,
-                      machine.instances,
-                      machine.cards,
-                      {}};
+    Platform platform = machine.with(dialogs);
     IdleEnd idle{{true, 90, {}, 30, 365}, platform, chain};
 };
 

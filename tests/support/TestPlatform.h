@@ -143,6 +143,13 @@ public:
         , instances(drives.dataFolder())
         , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, cards, {}} {}
 
+    // The platform with another part in the place of its own.
+    Platform with(Dialogs& other, Cards& media, Internet& line) {
+        return {files, other, line, mail, shell, clock, pump, volume, instances, media, {}};
+    }
+    Platform with(Dialogs& other) { return with(other, cards, noInternet); }
+    Platform with(Cards& media) { return with(dialogs, media, noInternet); }
+
     QTemporaryDir folder;
     Drives drives;
     Files files;

@@ -150,8 +150,7 @@ TEST_F(FtpFrmTest, ThanksByNameAndSaysWhenTheCardMayGo) {
                                               [](const HostPath& path) { return path.extension() == ".card"; });
     });
     TestPlatform& test = rig.test;
-    const Platform platform{test.files,  test.dialogs,   lab,   test.mail, test.shell, test.clock, test.pump,
-                            test.volume, test.instances, cards, {}};
+    const Platform platform = test.with(test.dialogs, cards, lab);
     const auto wait = [](const auto& done) { return QTest::qWaitFor(done, 30000); };
     for (const auto sending : {Sending::Resend, Sending::NewOrder}) {
         fs::create_directories(card);

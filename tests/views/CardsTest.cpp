@@ -104,17 +104,7 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
     EXPECT_EQ(machine.drives.toDrive(media / "EOS"), u"D:\\"_path) << "known before its count";
     const Theme theme(1);
     QWidget window;
-    const Platform platform{machine.files,
-                            machine.dialogs,
-                            machine.noInternet,
-                            machine.mail,
-                            machine.shell,
-                            machine.clock,
-                            machine.pump,
-                            machine.volume,
-                            machine.instances,
-                            cards,
-                            {}};
+    const Platform platform = machine.with(cards);
     const PicturePicker picker(theme, &window, state, platform, u"x"_s, {}, {}, Dialogs::Offer::Pictures);
     const auto* grid = picker.findChild<QListWidget*>(u"pickerGrid"_s);
     QStringList rows;

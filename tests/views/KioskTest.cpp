@@ -33,17 +33,7 @@ struct KioskWindow : ::testing::Test, PageRig {
     Theme theme{1};
     MainWindow window{chain, state};
     ScreenDialogs dialogs{window, state, platform};
-    Platform platform{machine.files,
-                      dialogs,
-                      machine.noInternet,
-                      machine.mail,
-                      machine.shell,
-                      machine.clock,
-                      machine.pump,
-                      machine.volume,
-                      machine.instances,
-                      machine.cards,
-                      {}};
+    Platform platform = machine.with(dialogs);
     IdleEnd idle{state.kiosk, platform, chain};
     StaffCode staff{state, machine.files, machine.clock};
     KioskPanels panels{window, state, chain, idle, staff};

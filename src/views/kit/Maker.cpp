@@ -112,9 +112,13 @@ void setRole(QWidget* widget, const char* role) {
 }
 
 void changeRole(QWidget* widget, const char* role) {
-    if (widget->property("role").toString() == QLatin1StringView(role))
+    changeLook(widget, "role", QString::fromLatin1(role));
+}
+
+void changeLook(QWidget* widget, const char* property, const QVariant& value) {
+    if (widget->property(property) == value)
         return;
-    setRole(widget, role);
+    widget->setProperty(property, value);
     widget->setStyleSheet(widget->styleSheet());
 }
 

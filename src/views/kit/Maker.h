@@ -84,6 +84,8 @@ QLabel* makeLabel(QWidget* parent, const char* type);
 void setRole(QWidget* widget, const char* role);
 // The same for a widget that may have been shown, which takes its new look at once.
 void changeRole(QWidget* widget, const char* role);
+// Of any property that the style sheet asks for: the look follows it only when the sheet is set anew.
+void changeLook(QWidget* widget, const char* property, const QVariant& value);
 // The theme's icon in the theme's size for buttons.
 void setButtonIcon(QAbstractButton* button, const Theme& theme, const QString& icon, QColor colour);
 

@@ -32,13 +32,6 @@ QString unbrokenSize(const QString& text) {
     return isolated(text).replace(u" / "_s, u"\u00A0/\u00A0"_s);
 }
 
-void changeType(QLabel& label, const char* type) {
-    if (label.property("type").toString() == QLatin1StringView(type))
-        return;
-    label.setProperty("type", QString::fromLatin1(type));
-    label.setStyleSheet(label.styleSheet()); // the look follows the property only when it is set anew
-}
-
 // A long text stands in two lines, broken at the blank nearest to its middle.
 void breakLong(QPushButton& button) {
     QString text = button.text();
@@ -375,7 +368,7 @@ void kyoskNewView::renderClosing() {
     m_domain->display(c.Combo1Items, c.Combo1Index, c.Combo1.text, m_page.promptStands() ? Prompt : Choice);
     const AddressBox box = m_page.addressBox();
     m_at->setVisible(box == AddressBox::Mail);
-    changeType(*m_addressWord, m_page.addressTyped() ? "good" : "muted");
+    changeLook(m_addressWord, "type", m_page.addressTyped() ? u"good"_s : u"muted"_s);
     changeRole(m_withoutAddress, box == AddressBox::None ? "main" : "secondary");
     m_closing->setFirstFocus(box == AddressBox::Mail ? m_mail : box == AddressBox::AlbumMail ? m_albumMail : m_note);
     m_closing->setOpen(c.Frame4.visible);

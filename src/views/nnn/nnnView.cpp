@@ -289,10 +289,7 @@ void nnnView::render() {
     speak(m_telephone, c.LabelText3.text);
     speak(m_address, c.LabelText4.text);
     speak(m_moreSizes, c.LabelCombo1.text);
-    if (m_address->property("wanted").toBool() != c.Text4Calls) {
-        m_address->setProperty("wanted", c.Text4Calls);
-        m_address->setStyleSheet(m_address->styleSheet()); // the look follows the property only when it is set anew
-    }
+    changeLook(m_address, "wanted", c.Text4Calls);
     m_sample->setCode(borderCode(std::max(c.Picture16, 0)));
     speak(m_sample, c.LabelPicture16.text);
     m_hint->setVisible(c.LabelTerms.visible);
