@@ -1,9 +1,9 @@
 #include "assembly/Preparation.h"
 
-#include "assembly/edited/KeptWork.h"
 #include "common/FixedText.h"
 #include "order/BasketLine.h"
 #include "order/KeptPictures.h"
+#include "order/KeptWork.h"
 #include "order/PrintCode.h"
 #include "order/PrintFileName.h"
 #include "order/UnfinishedOrders.h"
@@ -45,10 +45,6 @@ void Preparation::takeHandOver() {
         return;
     m_noJpeg = m_state.transfer.leftOut;
     m_noJpeg.removeIf([](const LeftOut& picture) { return picture.why != LeftOut::Why::NoJpeg; });
-    const Workspace workspace(m_state, m_platform.files);
-    QString number = m_state.MisparHazmana; // the order has its own
-    if (workspace.MakeWorkspace())
-        static_cast<void>(workspace.CleanWorkspace(number));
     KeptWork(m_state, m_platform.files, OrderFolder(before)).bringBack();
     if (goesOn.isEmpty())
         return;

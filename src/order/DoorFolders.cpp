@@ -39,6 +39,11 @@ DrivePath newDoorFolder(const Files& files) {
     return doorFolders(files) / QUuid::createUuid().toString(QUuid::Id128).left(12);
 }
 
+DrivePath doorFolderOf(const OrderState& order, const Files& files) {
+    const QSet<QString> folders = foldersOf(order, files);
+    return order.keptIn.isEmpty() && !folders.isEmpty() ? DrivePath(*folders.begin()) : DrivePath(order.keptIn);
+}
+
 void removeDoorFolders(const Files& files, const OrderState& order) {
     for (const QString& folder : foldersOf(order, files))
         static_cast<void>(files.removeTree(DrivePath(folder))); // the next start tries again

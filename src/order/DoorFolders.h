@@ -16,6 +16,9 @@ struct SessionState;
 // an order that was sent long ago still has the lines that led to its own.
 DrivePath newDoorFolder(const Files& files);
 
+// The folder of this order; empty for one that has none.
+DrivePath doorFolderOf(const OrderState& order, const Files& files);
+
 // The way back of an order is closed.
 void removeDoorFolders(const Files& files, const OrderState& order);
 

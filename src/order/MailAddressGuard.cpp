@@ -29,6 +29,13 @@ QString domainIn(const TypedAddress& typed) {
 
 } // namespace
 
+TypedAddress TypedAddress::of(const QString& address) {
+    const qsizetype at = address.lastIndexOf(u'@');
+    if (address == mailNotTyped)
+        return {{}, {}, true};
+    return at < 0 ? TypedAddress{address, {}, true} : TypedAddress{address.left(at), address.mid(at + 1), false};
+}
+
 QString MailAddressGuard::address(const TypedAddress& typed) const {
     if (!m_state.Careful)
         return typed.name + u'@' + typed.domain;

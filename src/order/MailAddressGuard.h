@@ -6,11 +6,17 @@ namespace lumora {
 
 struct SessionState;
 
+// What an order has in the place of the address of a customer who gives none.
+inline const QString mailNotTyped = QStringLiteral("לא הוקלד");
+
 // A mail address as it is typed in two boxes.
 struct TypedAddress {
     QString name;           // before the "@"
     QString domain;         // behind it
     bool untouched = false; // the box of the domain still shows its prompt
+
+    // As it would be typed for this address.
+    static TypedAddress of(const QString& address);
 };
 
 // Makes one mail address of the two boxes. As built in they are joined as they stand, the prompt too.

@@ -36,6 +36,7 @@ QList<Choice> choicesIn(SessionState& state) {
                              {u"DchisaAmoka"_s, &state.DchisaAmoka},
                              {u"SugTzad"_s, &state.SugTzad},
                              {u"BranchChoice"_s, &state.BranchChoice},
+                             {u"MisparKoopon"_s, &state.coupon.MisparKoopon},
                              {u"Shemot.Soog1"_s, &shemot.Soog1},
                              {u"Shemot.Soog2"_s, &shemot.Soog2},
                              {u"Shemot.CustomCode"_s, &shemot.CustomCode},

@@ -7,6 +7,7 @@
 #include "order/FinishedOrder.h"
 #include "order/KeptPictures.h"
 #include "order/LeftOutPictures.h"
+#include "order/MailAddressGuard.h"
 #include "order/OrderChoices.h"
 #include "order/OrderCompleteness.h"
 #include "order/OrderDetailsReader.h"
@@ -88,17 +89,39 @@ bool isNewer(const UnfinishedOrder& order, const UnfinishedOrder& other) {
     return place(order) > place(other);
 }
 
+ClosingEntries closingOf(const SessionState& state) {
+    const TypedAddress address = TypedAddress::of(state.shemot.Mail);
+    ClosingEntries closing{address.name, address.domain, -1, address.untouched, state.shemot.Hearot};
+    if (const QString branch = u" - "_s + state.BranchChoice; closing.Text2.endsWith(branch))
+        closing.Text2.chop(branch.size());
+    return closing;
+}
+
+// As the page of pictures handed the order over. Without its picture a print can't be made again, so that the order
+// stays as it is where one is gone.
+void giveWayBack(const UnfinishedOrder& order, SessionState& state, const Files& files) {
+    state.handOver.takenUp = order.folder.path();
+    if (order.state.choices.isEmpty() || GonePictures(state, files, order) > 0)
+        return;
+    HandOver& back = state.handOver;
+    back.basket = order.state.items;
+    for (const QString& text : back.basket) {
+        if (const BasketLine line = BasketLine::split(text, lineFormOf(order.state.kind)); line.hasUsableName())
+            back.pictures += line.path.text();
+    }
+    back.closing = closingOf(state);
+    back.details = state.shemot;
+    back.doorFolder = doorFolderOf(order.state, files);
+}
+
 void takeUpPreparation(const UnfinishedOrder& order, SessionState& state) {
-    state.handOver = {};
     state.handOver.lines = order.state.items;
     state.handOver.pressStart = printsAsTheyAre(order.state.kind);
-    state.handOver.takenUp = order.folder.path();
     state.transfer.Mefurak = Travel::Whole;
 }
 
 void takeUpSending(const UnfinishedOrder& order, SessionState& state, const Files& files) {
     const bool inPieces = TravelsInPieces(order.folder.name());
-    state.handOver = {};
     state.MisparHazmana = order.state.number;
     state.Optint = order.state.kind;
     state.shemot.ser = order.state.serial;
@@ -245,6 +268,8 @@ QList<UnfinishedOrder> UnfinishedOrders(const SessionState& state, const Files& 
 Outcome TakeUpOrder(const UnfinishedOrder& order, SessionState& state, const Files& files) {
     TakeChoices(order.state.choices, state);
     state.keptFolder = DrivePath(order.state.keptIn);
+    state.handOver = {};
+    giveWayBack(order, state, files);
     if (order.state.phase == Phase::Preparing) {
         takeUpPreparation(order, state);
         return printsAsTheyAre(order.state.kind) ? Outcome::PlainTakenUp : Outcome::EditedTakenUp;

@@ -85,6 +85,35 @@ TEST_F(AlbumTest, AnAlbumGoesPanelByPanelToThePictures) {
     EXPECT_EQ(state.album.KamutHorim + state.album.SoogHorim + state.album.HearotLBM, u"230/60");
 }
 
+TEST_F(AlbumTest, ThePicturesLeadBackToTheAlbumAsItIs) {
+    for (const bool cancels : {true, false}) {
+        nnn& page = atBill();
+        page.album().Command22_Click();
+        const AlbumDetails before = state.album;
+        ASSERT_TRUE(chain.follow(PageId::kyoskNew, Outcome::DetailsWanted));
+        nnn& changed = static_cast<nnn&>(*chain.front());
+        AlbumPanels& album = changed.album();
+        EXPECT_EQ(album.panel(), Panel::Kind);
+        changed.Command4_Click();
+        EXPECT_FALSE(changed.controls().Command4.visible || album.controls().Check5.visible);
+        album.Command17_Click();
+        album.Command16_Click();
+        for (const auto next : {&AlbumPanels::Command18_Click, &AlbumPanels::Command19_Click,
+                                &AlbumPanels::Command20_Click, &AlbumPanels::Command21_Click})
+            (album.*next)();
+        EXPECT_FALSE(album.controls().Check6.visible) << "the terms were agreed to";
+        EXPECT_EQ(before.SoogHorim + state.album.MailZalam + state.album.Tosafot2[2],
+                  u"30/60studio@example.comפינות עגולות=1"_s);
+        album.Combo4Godel_Click(5);
+        album.Command21_Click();
+        cancels ? changed.Command2_Click() : album.Command22_Click();
+        ASSERT_EQ(chain.front()->id(), PageId::kyoskNew) << qPrintable(machine.dialogs.messages.join(u'\n'));
+        EXPECT_EQ(chain.find(PageId::nnn), nullptr);
+        EXPECT_EQ(state.album.GodelLBM + state.shemot.ppr, cancels ? "30/6030/60" : "40/8040/80");
+        chain.unload(PageId::kyoskNew);
+    }
+}
+
 TEST_F(AlbumTest, WhatIsMissingIsToldOnThePanelWhereItIsSetRight) {
     const struct {
         const char* what;
@@ -270,6 +299,7 @@ TEST_F(AlbumTest, TheAlbumsEndRulesWhetherTheCustomersDetailsStay) {
         page.album().Command22_Click();
         const Result<QByteArray> stored = machine.files.read(customerStore);
         EXPECT_TRUE(c.stored ? stored && stored->contains(c.stored) : !stored) << (&c - cases);
+        chain.unload(PageId::kyoskNew);
     }
 }
 

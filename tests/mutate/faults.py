@@ -473,7 +473,7 @@ FAULTS = {
         F('OrderTail::shortWidth', 'OrderTail::longWidth', 'edited orders have a tail that the lab does not read'),
         F('name.size() - 8', 'name.size() - 4', 'captions of the sheet are longer',
           told='the ending stands in a caption too; log and print carry the name')],
-    'src/assembly/edited/KeptWork.cpp': [
+    'src/order/KeptWork.cpp': [
         F('copy == line.path || !m_files.fileExists(copy)', 'true', 'corrections are not kept aside'),
         F('static_cast<void>(m_files.keepCopy(kept / name, scratch / name));', 'static_cast<void>(name);',
           'corrections that were kept aside do not come back')],

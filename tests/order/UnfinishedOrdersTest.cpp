@@ -245,11 +245,42 @@ TEST_F(OrdersOfAKiosk, TellHowFarTheyCameAndAreTakenUpWithAllThatWasChosen) {
         EXPECT_EQ(sending.MisparHazmana, u"105");
         EXPECT_EQ(sending.shemot.n1, u"Dana Levi") << "what the report says is known until it is sent";
         EXPECT_TRUE(sending.handOver.lines.isEmpty());
+        EXPECT_TRUE(sending.handOver.basket.isEmpty()) << "the only print of a picture that is gone";
         QList<LeftOut::Why> reasons;
         for (const LeftOut& picture : sending.transfer.leftOut)
             reasons += picture.why;
         EXPECT_EQ(reasons, QList({LeftOut::Why::NoJpeg, LeftOut::Why::Name, LeftOut::Why::NotTold}));
         EXPECT_EQ(sending.transfer.leftOutAsked, way == Way::Http) << "its sending had begun";
+    }
+}
+
+TEST_F(OrdersOfAKiosk, LeadBackToTheirPicturesAfterARestart) {
+    std::filesystem::create_directories(*test.drives.toHost(u"C:\\pics"_path));
+    for (const Phase phase : {Phase::Preparing, Phase::Prepared}) {
+        OrderState order = inPhase(phase);
+        order.items.removeLast();
+        order.items += u"2 1015GNBC:\\2000lumora\\zmany\\door\\0123456789ab\\k\\a.jpg"_s;
+        for (const QString& path : {order.items[0], order.items[1], order.items[3]}) {
+            std::filesystem::create_directories(*test.drives.toHost(DrivePath(path.mid(9)).folder()));
+            ASSERT_TRUE(test.files.writeWhole(DrivePath(path.mid(9)), "x"));
+        }
+        session.shemot.Mail = u"dana@gmail.com"_s;
+        session.shemot.Hearot = u"a - gift - Haifa"_s;
+        session.BranchChoice = u"Haifa"_s;
+        session.coupon.MisparKoopon = 3;
+        order.choices = ChoicesOf(session);
+        SessionState next;
+        next.DiskRoot = session.DiskRoot;
+        TakeUpOrder({give(name, order, {print}), order}, next, test.files);
+        const HandOver& back = next.handOver;
+        EXPECT_EQ(back.basket, order.items);
+        EXPECT_EQ(back.pictures, QStringList({u"C:\\pics\\one.jpg"_s, u"C:\\pics\\two.jpg"_s, order.items[3].mid(9)}));
+        EXPECT_EQ(back.closing.Text1 + u'|' + back.closing.Combo1 + u'|' + back.closing.Text2,
+                  u"dana|gmail.com|a - gift");
+        EXPECT_FALSE(back.closing.promptStands);
+        EXPECT_EQ(back.details.n1, u"Dana Levi");
+        EXPECT_EQ(back.doorFolder.text(), u"C:\\2000lumora\\zmany\\door\\0123456789ab");
+        EXPECT_EQ(next.coupon.MisparKoopon, 3);
     }
 }
 

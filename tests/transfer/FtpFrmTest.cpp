@@ -3,7 +3,9 @@
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
 #include "order/PrintFile.h"
+#include "order/UnfinishedOrders.h"
 #include "platform/media/MediaFolders.h"
+#include "session/Workspace.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/OrderFiles.h"
 
@@ -203,6 +205,11 @@ TEST(FtpFrm, LeadsBackToThePicturesUntilTheSendingBegins) {
             SessionState& state = line.rig.state;
             state.handOver.basket = {u"1 1015GNBC:\\a.jpg"_s};
             state.handOver.details.n1 = u"Иван"_s;
+            state.handOver.takenUp = FtpFrmRig::folder();
+            const QString corrected = u"C;]a.jpg"_s;
+            const DrivePath kept = KeptWorkFolder(OrderFolder(FtpFrmRig::folder()), WorkspacePaths::tempred(state));
+            line.rig.makeFolder(kept);
+            line.rig.PageRig::write(kept / corrected, "x");
             if (sending == Sending::Resend)
                 line.rig.takeUpAgain({FtpFrmRig::log(), FtpFrmRig::first()});
             line.rig.registerBare({PageId::kyoskNew});
@@ -218,6 +225,8 @@ TEST(FtpFrm, LeadsBackToThePicturesUntilTheSendingBegins) {
             EXPECT_EQ(state.handOver.back, may);
             EXPECT_EQ(line.rig.test.files.folderExists(FtpFrmRig::folder()), !may);
             EXPECT_EQ(state.shemot.n1 == u"Иван"_s, may) << "not as the log has it";
+            EXPECT_EQ(line.rig.test.files.fileExists(WorkspacePaths::tempred(state) / corrected), may)
+                << "what another run has made of a picture";
         }
     }
 }

@@ -2,7 +2,7 @@
 
 #include "assembly/Preparation.h"
 #include "assembly/edited/EditedPrints.h"
-#include "assembly/edited/KeptWork.h"
+#include "order/KeptWork.h"
 
 namespace lumora {
 

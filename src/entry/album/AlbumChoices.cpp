@@ -71,4 +71,8 @@ QString orderedItem(AlbumChoice choice, int row) {
     return list.items.value(row, list.prompt);
 }
 
+int orderedRow(AlbumChoice choice, const QString& item) {
+    return static_cast<int>(listOf(choice).items.indexOf(item));
+}
+
 } // namespace lumora

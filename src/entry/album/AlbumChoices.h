@@ -22,6 +22,8 @@ QStringList albumItems(AlbumChoice choice, bool english);
 // What the order carries for a row in either language: the Hebrew item, or the Hebrew prompt for a row that is not
 // there.
 QString orderedItem(AlbumChoice choice, int row);
+// The row of an item that an order carries; -1 where none was taken.
+int orderedRow(AlbumChoice choice, const QString& item);
 
 // The most copies of the album that the parents can have.
 constexpr int mostParentCopies = 4;

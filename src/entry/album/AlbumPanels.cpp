@@ -57,6 +57,39 @@ void AlbumPanels::begin() {
     Q_EMIT focusWanted(u"Text1(0)"_s);
 }
 
+void AlbumPanels::change() {
+    const AlbumDetails& album = m_state.album;
+    const TypedAddress address = TypedAddress::of(album.MailZalam);
+    const QString boxes[] = {album.ShemZalam, album.TelZalam, album.ShemErooa, address.name};
+    for (std::size_t i = 0; i < Text1.size(); ++i)
+        Text1[i].text = boxes[i];
+    Combo4Mail.fill(mailDomains(), address.untouched ? mailDomainPrompt(english()) : address.domain);
+    Combo4Mail.take(Combo4Mail.rows.find(address.domain));
+    m_kind = orderedRow(AlbumChoice::Kind, album.SoogLBM);
+    showKinds();
+    Label17.text = kindName();
+    m_copies = std::clamp(Val16(album.KamutHorim), std::int16_t{0}, std::int16_t{mostParentCopies});
+    Label32.text = QString::number(m_copies);
+    Check4.checked = m_copies > 0;
+    Combo4Horim.fill(itemsOf(AlbumChoice::ParentSize), promptOf(AlbumChoice::ParentSize));
+    takeParentSize(Combo4Horim.rows.find(album.SoogHorim));
+    fillLists();
+    Combo4Godel.take(orderedRow(AlbumChoice::Size, album.GodelLBM));
+    Combo4Cricha.take(orderedRow(AlbumChoice::Cover, album.SoogKricha));
+    Combo4Niyar.take(orderedRow(AlbumChoice::Paper, album.SoogNiar));
+    Combo4Tosefet.take(orderedRow(AlbumChoice::Extra, album.Tosafot1[0]));
+    for (std::size_t i = 0; i < Check3.size(); ++i)
+        Check3[i].checked = album.Tosafot2[i].endsWith(u"=1"_s);
+    Pic4Alboom.visible = true;
+    open(Panel::Kind);
+}
+
+void AlbumPanels::showChange(const QString& wayBack) {
+    Command22.text = wayBack;
+    for (Caption* part : std::initializer_list<Caption*>{&Check5, &Command28, &Check6, &Command25})
+        part->visible = false;
+}
+
 void AlbumPanels::close() {
     stopSliding();
     Pic4Alboom.visible = false;
@@ -204,12 +237,16 @@ void AlbumPanels::leaveKind() {
         Q_EMIT focusWanted(m_kind < 0 ? u"SoogAlb(0)"_s : u"Combo4Horim"_s);
         return;
     }
-    // A list is filled once, so that the choice stays when the panels open again.
+    fillLists();
+    goOnTo(Panel::Size);
+}
+
+// A list is filled once, so that the choice stays when the panels open again.
+void AlbumPanels::fillLists() {
     for (const ListRow& row : listTable()) {
         if (row.list.rows.isEmpty())
             row.list.fill(itemsOf(row.choice), promptOf(row.choice));
     }
-    goOnTo(Panel::Size);
 }
 
 // --- size, cover, paper, extras ---

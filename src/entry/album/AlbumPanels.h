@@ -28,6 +28,10 @@ public:
 
     // A new album: nothing is chosen, and the photographer's panel is open. The photographer's details stay.
     void begin();
+    // The album of the session is changed: the panels show it, from its kind on.
+    void change();
+    // Hides what is asked of a new album alone: the terms were agreed to, and what is remembered was decided.
+    void showChange(const QString& wayBack);
     void close();
     // One panel back; false on the first.
     bool back();
@@ -92,6 +96,7 @@ private:
     // Carefully what the open panel has to have is asked for before it is left.
     bool isWhole();
     void goOnTo(Panel next);
+    void fillLists();
     void showPanel();
     QString choiceSoFar() const;
 

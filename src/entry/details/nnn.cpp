@@ -346,6 +346,11 @@ void nnn::finishPrints() {
 }
 
 void nnn::takeAlbum() {
+    if (isChanging()) {
+        if (!m_leaving)
+            leaveChange();
+        return;
+    }
     rememberOrForget();
     takeDetails(m_state.shemot, Text2.text, Text3.text, Text4.text);
     finishAlbum();
@@ -416,7 +421,7 @@ void nnn::GoToSelection() {
 // --- ways back ---
 
 void nnn::cancel() {
-    if (m_leaving || (m_step == Step::Album && !asksToCancelAlbum()))
+    if (m_leaving || (m_step == Step::Album && !isChanging() && !asksToCancelAlbum()))
         return;
     if (isChanging())
         return cancelChange();

@@ -161,6 +161,7 @@ private:
     struct Before {
         OrderDetails details;
         CouponState coupon;
+        AlbumDetails album;
     };
     std::optional<Before> m_before;
     Focus m_focus;

@@ -17,11 +17,15 @@ using namespace Qt::StringLiterals;
 // The page shows the order as it is. The terms were agreed to.
 void nnn::beginChange() {
     const OrderDetails& order = m_state.shemot;
-    m_before = Before{order, m_state.coupon};
+    m_before = Before{order, m_state.coupon, m_state.album};
     const auto typed = [](const QString& text) { return text == notChosen ? QString() : text; };
     Text2.text = typed(order.n1);
     Text3.text = typed(order.n2);
     Text4.text = typed(order.n3);
+    if (m_state.Optint == OrderKind::Album) {
+        m_album.change();
+        return open(Step::Album);
+    }
     for (std::size_t i = 0; i < Option1.size(); ++i)
         Option1[i].checked = !m_quickSizes[i].isEmpty() && m_quickSizes[i].trimmed() == order.ppr;
     Combo1.text = order.ppr;
@@ -52,7 +56,14 @@ void nnn::showChange() {
         part->visible = false;
     if (m_step == Step::Terms)
         Title.text = LabelChoice.text;
-    if (m_step == Step::Details)
+    bool isFirst = m_step == Step::Details;
+    if (m_step == Step::Album) {
+        m_album.showChange(Command3.text);
+        isFirst = m_album.panel() == AlbumPanels::Panel::Photographer;
+        if (m_album.panel() == AlbumPanels::Panel::Bill)
+            Title.text = m_album.controls().Pic4Bil.text;
+    }
+    if (isFirst)
         Command4.visible = false;
 }
 
@@ -64,6 +75,7 @@ void nnn::leaveChange() {
 void nnn::cancelChange() {
     m_state.shemot = m_before->details;
     m_state.coupon = m_before->coupon;
+    m_state.album = m_before->album;
     leaveChange();
 }
 

@@ -34,9 +34,8 @@ void kyoskNew::forgetEditing() {
     m_state.edit.EditState = EditRecord::beforeAnyPicture();
 }
 
-// An album's size is chosen with the album.
 bool kyoskNew::mayChangeDetails() const {
-    return m_state.Optint != OrderKind::Album && m_chain.canFollow(pageId, Outcome::DetailsWanted);
+    return m_chain.canFollow(pageId, Outcome::DetailsWanted);
 }
 
 void kyoskNew::openDetails() {

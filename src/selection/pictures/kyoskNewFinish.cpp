@@ -17,12 +17,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-const QString notTyped = u"לא הוקלד"_s; // the mail address of a customer who gives none
-
-} // namespace
-
 void kyoskNew::finish() {
     onceMade(&kyoskNew::openFinish);
 }
@@ -235,11 +229,11 @@ void kyoskNew::goOnWithAddress() {
             u"Please choose or type the mail provider,\nbehind the at sign");
         return focusOn(u"Combo1"_s);
     }
-    handOver(address.isEmpty() ? notTyped : address);
+    handOver(address.isEmpty() ? mailNotTyped : address);
 }
 
 void kyoskNew::goOnWithoutAddress() {
-    handOver(plain() ? notTyped : m_state.shemot.Mail);
+    handOver(plain() ? mailNotTyped : m_state.shemot.Mail);
 }
 
 // The sheet and the log of an album have the address as it is corrected here.

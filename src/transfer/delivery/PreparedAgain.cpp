@@ -51,6 +51,7 @@ bool PreparedAgain::handOver(const IsTaken& isTaken) {
     ++m_state.handOver.renumbered;
     m_state.handOver.lines = kept.items;
     m_state.handOver.basket.clear();
+    m_state.handOver.takenUp = {};
     m_state.keptFolder = DrivePath(kept.keptIn);
     m_state.handOver.pressStart = plain; // the page of edited orders starts by itself
     m_state.handOver.replaced = m_order.folder().path();

@@ -1,6 +1,7 @@
 #include "transfer/delivery/SendingPage.h"
 
 #include "order/CompletenessGuard.h"
+#include "order/KeptWork.h"
 #include "order/LeftOutPictures.h"
 #include "order/OrderFolder.h"
 #include "order/OrderJournal.h"
@@ -164,8 +165,17 @@ Bitmap SendingPage::smallLeftOut(int index, int cell) const {
 // Nothing has left the machine before the order is listed; a step by hand may still write into its folder.
 void SendingPage::goBack() {
     const bool busy = isUnderWay(m_phase) || (lineInUse() && m_phase != SendingPhase::Preparing);
-    if (!busy && m_leftOut.goBack())
+    if (busy || !m_leftOut.isOpen())
+        return;
+    bringWorkBack();
+    if (m_leftOut.goBack())
         TakeOrderBack(m_state, m_platform);
+}
+
+// An order that was made in another run.
+void SendingPage::bringWorkBack() const {
+    if (const OrderFolder order = OrderFolder::chosen(m_state); m_state.handOver.takenUp == order.path())
+        KeptWork(m_state, m_platform.files, order).bringBack();
 }
 
 void SendingPage::endWayBack() {
@@ -187,6 +197,7 @@ void SendingPage::change() {
     if (!mayChange())
         return;
     stopTimers();
+    bringWorkBack();
     if (goBackToPictures(id(), m_state, m_chain))
         TakeOrderBack(m_state, m_platform);
 }

@@ -145,6 +145,7 @@ private:
     // Nothing of the order has left the machine.
     bool mayChange() const;
     void change();
+    void bringWorkBack() const;
     // What the log of an order that is sent again names as failed.
     void readLeftOut();
     void activateWhenFree();

@@ -1,4 +1,4 @@
-#include "assembly/edited/KeptWork.h"
+#include "order/KeptWork.h"
 
 #include "order/UnfinishedOrders.h"
 #include "platform/files/Files.h"
@@ -41,6 +41,10 @@ Result<void> KeptWork::keep(const DrivePath& file) const {
 }
 
 void KeptWork::bringBack() const {
+    const Workspace workspace(m_state, m_files);
+    QString number; // of the next order, which this one does not take
+    if (workspace.MakeWorkspace())
+        static_cast<void>(workspace.CleanWorkspace(number));
     for (const DrivePath& scratch : {WorkspacePaths::tempred(m_state), WorkspacePaths::jobFolder(m_state)}) {
         const DrivePath kept = KeptWorkFolder(m_folder, scratch);
         // A picture that is missing here fails, and is named.

@@ -19,7 +19,7 @@ public:
     // The corrected copies that the lines of the basket name.
     Result<void> keepCorrected(const QStringList& lines) const;
     Result<void> keepThumbnail(const DrivePath& thumbnail) const;
-    // Puts all that is kept back into the scratch folders.
+    // The scratch folders hold what is kept, and nothing of another order.
     void bringBack() const;
 
 private:
