@@ -103,6 +103,18 @@ TEST_P(RedEyeHands, FollowsADragAndAHeldArrow) {
     EXPECT_FALSE(page().holds());
 }
 
+TEST_P(RedEyeHands, BringTheCircleToAnEyeByArrowsAlone) {
+    walk.activate();
+    for (const auto& [name, key, times] :
+         {std::tuple(u"Picture3"_s, Qt::Key_Left, 6), {u"Picture3"_s, Qt::Key_Up, 4}, {u"Picture1"_s, Qt::Key_Up, 6}}) {
+        walk.control(name).setFocus(Qt::TabFocusReason);
+        for (int i = 0; i < times; ++i)
+            walk.key(key);
+    }
+    EXPECT_LT((searched() - Walk::redEye).manhattanLength(), 12);
+    EXPECT_TRUE(walk.pressable(u"RedI"_s, u"Image2"_s));
+}
+
 TEST_P(RedEyeOperator, FindsThePeakAndHasNoFaultInItsTools) {
     pressOverview(Walk::redEye);
     go(u"Command13 Command6 Image2 :redi-8-operator"_s);

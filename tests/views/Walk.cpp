@@ -6,18 +6,11 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "support/Take.h"
-#include "views/kit/ChoiceCards.h"
-#include "views/kit/Overlay.h"
-#include "views/kit/TouchKeyboard.h"
 #include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 #include "views/window/PageView.h"
 #include "views/window/ScreenDialogs.h"
 
-#include <QAbstractButton>
-#include <QAbstractItemModel>
-#include <QAbstractScrollArea>
-#include <QAccessible>
 #include <QApplication>
 #include <QComboBox>
 #include <QDateTime>
@@ -25,19 +18,13 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QImage>
-#include <QLabel>
 #include <QLineEdit>
-#include <QListWidget>
 #include <QLockFile>
 #include <QPainter>
-#include <QPushButton>
 #include <QRegularExpression>
-#include <QScrollArea>
 #include <QTest>
 
 #include <gtest/gtest.h>
-
-#include <algorithm>
 
 namespace lumora {
 
@@ -46,39 +33,6 @@ namespace {
 // No order of a test may leave the machine: nobody listens at this port.
 constexpr const char* labText = "[Server]\nHost = 127.0.0.1:9\nUser = u\nPassword = p\n[Lab]\nPhone = 03-1234567\n"
                                 "Mail = lab@example.com\n";
-
-bool hasHebrew(const QString& text) {
-    return std::any_of(text.begin(), text.end(),
-                       [](QChar c) { return c.unicode() >= 0x0590 && c.unicode() <= 0x05FF; });
-}
-
-QString nameOf(const QWidget& widget) {
-    return u"%1 \"%2\""_s.arg(QString::fromLatin1(widget.metaObject()->className()), widget.objectName());
-}
-
-void unnamed(QAccessibleInterface* node, QStringList& faults) {
-    if (!node || !node->isValid() || node->state().invisible)
-        return;
-    switch (node->role()) {
-    case QAccessible::Button:
-    case QAccessible::CheckBox:
-    case QAccessible::RadioButton:
-    case QAccessible::EditableText:
-    case QAccessible::ComboBox:
-    case QAccessible::List:
-        if (node->text(QAccessible::Name).trimmed().isEmpty() && node->object() &&
-            node->object()->objectName() != u"qt_scrollarea_viewport"_s)
-            faults += u"no accessible name: %1 \"%2\""_s.arg(
-                QString::fromLatin1(node->object()->metaObject()->className()), node->object()->objectName());
-        break;
-    default:
-        break;
-    }
-    if (node->role() == QAccessible::ComboBox)
-        return; // its rows are a window of their own
-    for (int i = 0; i < node->childCount(); ++i)
-        unnamed(node->child(i), faults);
-}
 
 // Beside the test program, made by the first of its processes and again where the program is newer: each test is a
 // process of its own, which would spend half its time on them.
@@ -96,66 +50,6 @@ HostPath photographs() {
         return made;
     }();
     return toHostPath(folder);
-}
-
-QString rowsOf(const QAbstractItemModel& model) {
-    QString all;
-    for (int row = 0; row < model.rowCount(); ++row)
-        all += model.index(row, 0).data().toString() + u' ';
-    return all;
-}
-
-// Of those that can be chosen.
-int leastRow(const QWidget& widget) {
-    int least = 44;
-    if (const auto* box = qobject_cast<const QComboBox*>(&widget); box && box->count() > 0) {
-        box->view()->ensurePolished();
-        least = box->view()->sizeHintForRow(0);
-    }
-    const auto* list = qobject_cast<const QListWidget*>(&widget);
-    for (int i = 0; list && list->focusPolicy() != Qt::NoFocus && i < list->count(); ++i) {
-        if (list->item(i)->flags() & Qt::ItemIsEnabled)
-            least = std::min(least, list->visualItemRect(list->item(i)).height());
-    }
-    return least;
-}
-
-bool insideScroller(const QWidget& widget) {
-    for (const QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
-        if (qobject_cast<const QAbstractScrollArea*>(parent))
-            return true;
-    }
-    return false;
-}
-
-// Drawn with room around it, the label puts ink outside its place. The rim of a letter may reach a pixel out.
-bool cutsInk(QLabel& label) {
-    constexpr int room = 30;
-    constexpr int rim = 1;
-    const QRect place = label.geometry();
-    const QMargins margins = label.contentsMargins();
-    label.setContentsMargins(margins + room);
-    label.setGeometry(place + QMargins(room, room, room, room));
-    QImage drawn(label.size(), QImage::Format_Alpha8);
-    drawn.fill(0);
-    label.render(&drawn, {}, {}, QWidget::RenderFlags());
-    label.setContentsMargins(margins);
-    label.setGeometry(place);
-    const QRect seen(QPoint(room - rim, room - rim), place.size() + QSize(2 * rim, 2 * rim));
-    for (int y = 0; y < drawn.height(); ++y) {
-        for (int x = 0; x < drawn.width(); ++x) {
-            if (!seen.contains(x, y) && drawn.constScanLine(y)[x] > 64)
-                return true;
-        }
-    }
-    return false;
-}
-
-QString clippedText(const QWidget& widget) {
-    if ((qobject_cast<const QPushButton*>(&widget) || widget.inherits("QCheckBox")) &&
-        widget.sizeHint().width() > widget.width() + 1)
-        return u"needs %1 and is %2 wide"_s.arg(widget.sizeHint().width()).arg(widget.width());
-    return {};
 }
 
 } // namespace
@@ -342,89 +236,6 @@ void Walk::shot(const QString& name) {
         return;
     const QPixmap grab = m_program->window().grab();
     EXPECT_TRUE(grab.save(u"%1/%2-%3x%4.png"_s.arg(folder, name).arg(grab.width()).arg(grab.height())));
-}
-
-QStringList Walk::faults() {
-    const bool english = m_program->state().english();
-    QStringList result;
-    MainWindow& window = m_program->window();
-    unnamed(QAccessible::queryAccessibleInterface(&window), result);
-    const Overlay* panel = frontOverlay(window);
-    const auto* keys = window.findChild<TouchKeyboard*>();
-    const QWidget* root = keys && keys->isVisible() ? static_cast<const QWidget*>(keys)
-                          : panel                   ? static_cast<const QWidget*>(panel)
-                                                    : window.frontView();
-    if (root->layoutDirection() != (english ? Qt::LeftToRight : Qt::RightToLeft))
-        result += u"the page runs the other way"_s;
-    if (english && hasHebrew(window.windowTitle()))
-        result += u"a Hebrew title"_s;
-    for (const Controls::Entry& entry : m_program->chain().front()->controls().all()) {
-        if (!entry.caption)
-            continue;
-        const auto* cards = root->findChild<ChoiceCards*>(entry.name);
-        const auto* mark = cards ? cards->card(entry.caption->text) : root->findChild<QAbstractButton*>(entry.name);
-        if (mark && mark->isCheckable() &&
-            mark->isChecked() != (cards || static_cast<const CheckCaption&>(*entry.caption).checked))
-            result += u"%1 shows another mark than the page has"_s.arg(entry.name);
-    }
-    for (const auto* area : root->findChildren<QScrollArea*>()) {
-        const auto parts = area->widget()->findChildren<QWidget*>(Qt::FindDirectChildrenOnly);
-        for (auto at = parts.begin(); at != parts.end(); ++at) {
-            for (auto other = parts.begin(); other != at; ++other) {
-                if ((*at)->isVisible() && (*other)->isVisible() && (*at)->geometry().intersects((*other)->geometry()))
-                    result += u"%1 lies over %2"_s.arg(nameOf(**at), nameOf(**other));
-            }
-        }
-    }
-    for (QWidget* widget : root->findChildren<QWidget*>()) {
-        if (!widget->isVisible() || widget->size().isEmpty())
-            continue;
-        const auto* button = qobject_cast<const QAbstractButton*>(widget);
-        const bool control =
-            button ||
-            (qobject_cast<const QLineEdit*>(widget) && !qobject_cast<const QComboBox*>(widget->parentWidget())) ||
-            qobject_cast<const QComboBox*>(widget);
-        const bool partOfBox = widget->parentWidget() && widget->parentWidget()->inherits("QComboBox");
-        const bool foreign = insideScroller(*widget) || partOfBox;
-        if (control && !partOfBox && (widget->width() < 44 || widget->height() < 44))
-            result += u"%1 is %2x%3, under 44"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height());
-        if (const int row = leastRow(*widget); row < 44)
-            result += u"%1 has rows of %2, under 44"_s.arg(nameOf(*widget)).arg(row);
-        if (control && !foreign) {
-            if (widget->objectName().isEmpty())
-                result += u"no object name: "_s + nameOf(*widget);
-            const QRect whole = widget->rect();
-            if (widget->visibleRegion().boundingRect() != whole)
-                result += u"%1 is cut off"_s.arg(nameOf(*widget));
-        }
-        if (!foreign) {
-            const QString clipped = clippedText(*widget);
-            if (!clipped.isEmpty())
-                result += u"%1: %2"_s.arg(nameOf(*widget), clipped);
-            if (auto* label = qobject_cast<QLabel*>(widget); label && !label->text().isEmpty() && cutsInk(*label))
-                result += u"%1 \"%2\" loses ink at an edge"_s.arg(nameOf(*label), label->text());
-            if (qobject_cast<const QLabel*>(widget) && widget->visibleRegion().boundingRect() != widget->rect())
-                result += u"%1 \"%2\" is cut off"_s.arg(nameOf(*widget), qobject_cast<const QLabel*>(widget)->text());
-        }
-        if (!foreign && button && (button->text() + button->accessibleName()).trimmed().isEmpty())
-            result += u"no caption: "_s + nameOf(*widget);
-        if (english && !widget->property("letterOfAnyLanguage").toBool()) {
-            QString said = widget->accessibleName() + widget->accessibleDescription() + widget->toolTip();
-            if (button)
-                said += button->text();
-            if (const auto* label = qobject_cast<const QLabel*>(widget))
-                said += label->text();
-            if (const auto* box = qobject_cast<const QComboBox*>(widget))
-                said += box->placeholderText() + box->currentText() + rowsOf(*box->model());
-            if (const auto* line = qobject_cast<const QLineEdit*>(widget))
-                said += line->placeholderText();
-            if (const auto* list = qobject_cast<const QListWidget*>(widget))
-                said += rowsOf(*list->model());
-            if (hasHebrew(said))
-                result += u"Hebrew on an English page: %1: %2"_s.arg(nameOf(*widget), said);
-        }
-    }
-    return result;
 }
 
 } // namespace lumora

@@ -2,6 +2,7 @@
 
 #include "app/Program.h"
 #include "drive/ControlFinder.h"
+#include "drive/PageFaults.h"
 #include "imaging/files/PictureFile.h"
 #include "session/Page.h"
 #include "support/DrivePathLiteral.h"
@@ -89,7 +90,7 @@ public:
     // What the desktop was asked to open.
     QStringList opened;
     // All that is wrong with what the window shows now: each line names the control.
-    QStringList faults();
+    QStringList faults() { return pageFaults(program()); }
 
 private:
     Page* find(PageId id);

@@ -2,6 +2,7 @@
 
 #include "session/PageChain.h"
 #include "views/kit/ChoiceCards.h"
+#include "views/kit/PaletteBar.h"
 #include "views/kit/TouchKeyboard.h"
 #include "views/window/DoubledPress.h"
 #include "views/window/FieldKeyboard.h"
@@ -137,6 +138,14 @@ QWidget& target(QWidget& widget) {
 
 } // namespace
 
+ControlFinder::ControlFinder(MainWindow& window, Hand hand)
+    : m_window(window)
+    , m_hand(hand)
+    , m_keys(window) {
+    if (hand == Hand::Keys)
+        window.activateWindow();
+}
+
 QString ControlFinder::frontPage() const {
     return m_window.frontView() ? pageName(m_window.frontView()->page().id()) : QString();
 }
@@ -166,7 +175,13 @@ Result<QWidget*> ControlFinder::inSight(const QString& page, const QString& cont
     QWidget* widget = bound ? bound->widget.data() : (*found)->findChild<QWidget*>(control);
     if (!widget)
         return fail(u"%1 has no control %2 that can be pressed"_s.arg(page, control));
-    bringIntoSight(*widget);
+    if (m_hand == Hand::Keys) {
+        // A disabled or hidden control takes no keyboard, and what lies outside the window comes as it gets it.
+        if (const Result<void> there = m_keys.moveTo(*widget); !there)
+            return fail(u"%1.%2: %3"_s.arg(page, control, there.failure().message));
+    } else {
+        bringIntoSight(*widget);
+    }
     const QString why = unusable(*widget);
     if (!why.isEmpty())
         return fail(u"%1.%2 is %3"_s.arg(page, control, why));
@@ -188,6 +203,10 @@ Result<ControlFinder::Held> ControlFinder::hold(const QString& page, const QStri
     if (!widget)
         return widget.failure();
     QWidget& hit = target(**widget);
+    if (m_hand == Hand::Keys) {
+        m_keys.press(Qt::Key_Space);
+        return Held{*widget, {}, Qt::LeftButton, m_hand, (*widget)->window(), {}};
+    }
     return pressDown(hit, middleOf(hit));
 }
 
@@ -232,6 +251,8 @@ ControlFinder::Held ControlFinder::pressDown(QWidget& widget, QPoint at, Qt::Mou
 }
 
 void ControlFinder::letGo(const Held& held) const {
+    if (held.hand == Hand::Keys)
+        return m_keys.letGo(Qt::Key_Space);
     if (held.hand == Hand::Mouse) {
         if (held.widget && held.widget->isVisible())
             mouse(*held.widget, held.at, QEvent::MouseButtonRelease, Qt::NoButton, held.button);
@@ -245,6 +266,8 @@ void ControlFinder::letGo(const Held& held) const {
 }
 
 void ControlFinder::pressAgain() const {
+    if (m_hand == Hand::Keys)
+        return m_keys.hit(Qt::Key_Return);
     if (!m_last)
         return;
     QWidget* const hit = m_window.childAt(*m_last);
@@ -254,6 +277,8 @@ void ControlFinder::pressAgain() const {
 
 Result<void> ControlFinder::pressAt(const QString& page, const QString& control, QPointF percent,
                                     Qt::MouseButton button) const {
+    if (m_hand == Hand::Keys)
+        return pressFieldByKeys(page, control, percent);
     const Result<Held> held = hold(page, control, percent, button);
     if (!held)
         return held.failure();
@@ -261,7 +286,19 @@ Result<void> ControlFinder::pressAt(const QString& page, const QString& control,
     return {};
 }
 
+Result<void> ControlFinder::pressFieldByKeys(const QString& page, const QString& control, QPointF percent) const {
+    const Result<QWidget*> found = pressable(page, control);
+    if (!found)
+        return found.failure();
+    auto* bar = qobject_cast<PaletteBar*>(*found);
+    if (!bar)
+        return fail(u"no key presses a place of %1.%2"_s.arg(page, control));
+    return m_keys.choose(*bar, std::min(static_cast<int>(percent.x() / 100 * bar->fields()), bar->fields() - 1));
+}
+
 Result<void> ControlFinder::drag(const QString& page, const QString& control, QPointF from, QPointF to) const {
+    if (m_hand == Hand::Keys)
+        return fail(u"no key drags %1.%2"_s.arg(page, control));
     const Result<QWidget*> found = inSight(page, control);
     if (!found)
         return found.failure();
@@ -290,6 +327,8 @@ Result<void> ControlFinder::press(const QString& page, const QString& control) c
     const Result<QWidget*> widget = pressable(page, control);
     if (!widget)
         return widget.failure();
+    if (m_hand == Hand::Keys)
+        return m_keys.use(**widget);
     QWidget& hit = target(**widget);
     // A tick box is pressed on its box, since its label may cover the whole row.
     click(hit, m_hand == Hand::Finger ? placeToPress(hit) : middleOf(hit));
@@ -316,6 +355,12 @@ Result<void> ControlFinder::type(const QString& page, const QString& control, co
         }
         const Result<void> typed = touchType(page, control, text);
         return typed ? touchKey(u"keyDone"_s) : typed;
+    }
+    if (m_hand == Hand::Keys) {
+        m_keys.hit(Qt::Key_A, Qt::ControlModifier);
+        m_keys.hit(Qt::Key_Delete);
+        m_keys.type(text);
+        return {};
     }
     click(target(*widget), middleOf(target(*widget)));
     key(*widget, Qt::Key_A, {}, Qt::ControlModifier);
@@ -358,6 +403,8 @@ Result<void> ControlFinder::touchType(const QString& page, const QString& contro
 
 // The rows are a window of their own, which takes no press right behind the one that has opened it.
 Result<void> ControlFinder::chooseRow(QComboBox& box, int row) const {
+    if (m_hand == Hand::Keys)
+        return m_keys.choose(box, row);
     if (m_hand == Hand::Mouse) {
         box.setCurrentIndex(row);
         Q_EMIT box.textActivated(box.itemText(row)); // these follow a press on the row
@@ -395,6 +442,8 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
             QListWidgetItem* item = list->item(row);
             if (item->data(Qt::UserRole).toString() != text && item->text() != text)
                 continue;
+            if (m_hand == Hand::Keys)
+                return m_keys.choose(*list, row);
             list->scrollToItem(item);
             click(*list->viewport(), list->visualItemRect(item).center());
             return {};
@@ -405,6 +454,8 @@ Result<void> ControlFinder::choose(const QString& page, const QString& control, 
         QAbstractButton* card = cards->card(text);
         if (!card)
             return fail(u"%1.%2 has no row \"%3\""_s.arg(page, control, text));
+        if (m_hand == Hand::Keys)
+            return m_keys.use(*card);
         click(*card, middleOf(*card));
         return {};
     }
@@ -418,8 +469,11 @@ Result<void> ControlFinder::tick(const QString& page, const QString& control, bo
     auto* button = qobject_cast<QAbstractButton*>(*found);
     if (!button || !button->isCheckable())
         return fail(u"%1.%2 can't be ticked"_s.arg(page, control));
-    if (button->isChecked() != on)
-        click(*button, placeToPress(*button));
+    if (button->isChecked() == on)
+        return {};
+    if (m_hand == Hand::Keys)
+        return m_keys.use(*button);
+    click(*button, placeToPress(*button));
     return {};
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "common/Result.h"
+#include "drive/KeyHand.h"
 
 #include <QPoint>
 #include <QPointF>
@@ -17,16 +18,15 @@ namespace lumora {
 class MainWindow;
 class PageView;
 
-// What a person presses with. The finger types on the keys of the screen.
-enum class Hand { Mouse, Finger };
+// What a person presses with. The finger types on the keys of the screen, and who has only keys comes to a control by
+// Tab and the arrows.
+enum class Hand { Mouse, Finger, Keys };
 
 // Finds controls by their design names ("Command12", "Picture1(3)") and uses them as a person does: each operation
 // fails with a reason unless the control is there, visible, enabled and not covered.
 class ControlFinder {
 public:
-    explicit ControlFinder(MainWindow& window, Hand hand = Hand::Mouse)
-        : m_window(window)
-        , m_hand(hand) {}
+    explicit ControlFinder(MainWindow& window, Hand hand = Hand::Mouse);
 
     // The name of the page in front, "" if there is none.
     QString frontPage() const;
@@ -34,7 +34,7 @@ public:
     // Each operation takes the page's name and fails if that page is neither in front nor visible below a panel. For a
     // finger the page "keyboard" is the keys on the screen.
     Result<void> press(const QString& page, const QString& control) const;
-    // A mouse button or a finger held down on a control, which may vanish before it is released.
+    // A mouse button, a finger or the blank held down on a control, which may vanish before it is released.
     struct Held {
         QPointer<QWidget> widget;
         QPoint at;
@@ -43,7 +43,8 @@ public:
         QPointer<QWidget> window; // where a finger is lifted, whatever lies below it by then
         QPoint place;             // in that window
     };
-    // Points are in per cent of the control's width and height.
+    // Points are in per cent of the control's width and height. Keys know no points but the fields of a palette, and
+    // drag nothing.
     Result<Held> hold(const QString& page, const QString& control) const;
     Result<Held> hold(const QString& page, const QString& control, QPointF percent, Qt::MouseButton button) const;
     void letGo(const Held& held) const;
@@ -79,6 +80,7 @@ private:
     Held pressDown(QWidget& widget, QPoint at, Qt::MouseButton button = Qt::LeftButton) const;
     void click(QWidget& widget, QPoint at) const { letGo(pressDown(widget, at)); }
     Result<void> chooseRow(QComboBox& box, int row) const;
+    Result<void> pressFieldByKeys(const QString& page, const QString& control, QPointF percent) const;
     Result<void> touchKey(const QString& name) const;
     Result<PageView*> view(const QString& page) const;
     Result<QWidget*> inSight(const QString& page, const QString& control) const;
@@ -92,6 +94,7 @@ private:
 
     MainWindow& m_window;
     Hand m_hand;
+    KeyHand m_keys;
     mutable std::optional<QPoint> m_last; // in the window, where the hand was
 };
 

@@ -73,8 +73,9 @@ int play(int argc, char** argv) {
          {u"size"_s, u"The window, from 640x480 on."_s, u"WxH"_s, u"1280x1024"_s},
          {u"shots"_s, u"Where the pictures of shot go."_s, u"DIR"_s, u"."_s},
          {u"touch"_s, u"Presses and types with a finger where the lines name none."_s},
+         {u"keys"_s, u"Presses, types and chooses with a keyboard alone, by Tab, arrows, Enter and blank."_s},
          {u"twice"_s,
-          u"Presses once more, soon and at the same place, behind each press that changes what is in front."_s},
+          u"Presses once more, soon and at the same place or by the same key, behind each press that changes what is in front."_s},
          {u"walk"_s, u"In place of scenarios: presses what can be pressed, as this number draws it."_s, u"SEED"_s},
          {u"presses"_s, u"Of a walk, before it brings the order to its end."_s, u"NUMBER"_s, u"300"_s},
          {u"record"_s, u"Of a walk: an existing folder for what the pages showed."_s, u"DIR"_s, u"."_s}});
@@ -97,7 +98,9 @@ int play(int argc, char** argv) {
 
     if (parser.positionalArguments().isEmpty())
         return complain(u"No scenario is named; --help tells more."_s, notPlayed);
-    const Hand hand = parser.isSet(u"touch"_s) ? Hand::Finger : Hand::Mouse;
+    if (parser.isSet(u"touch"_s) && parser.isSet(u"keys"_s))
+        return complain(u"Presses come by --touch or by --keys"_s, notPlayed);
+    const Hand hand = parser.isSet(u"touch"_s) ? Hand::Finger : parser.isSet(u"keys"_s) ? Hand::Keys : Hand::Mouse;
     if (parser.isSet(u"walk"_s)) {
         RandomWalk seeded({parser.value(u"walk"_s).toUInt(), parser.value(u"presses"_s).toInt(),
                            parser.positionalArguments(), parser.value(u"record"_s), hand});

@@ -144,7 +144,9 @@ RedEyeOverview::RedEyeOverview(RedI& page, const Theme& theme, const RedEyeCanva
     : QWidget(parent)
     , m_page(page)
     , m_theme(theme)
-    , m_canvas(canvas) {}
+    , m_canvas(canvas) {
+    setFocusPolicy(Qt::TabFocus);
+}
 
 void RedEyeOverview::fit() {
     constexpr double tallest = 190;
@@ -190,6 +192,23 @@ void RedEyeOverview::paintEvent(QPaintEvent*) {
 void RedEyeOverview::mousePressEvent(QMouseEvent* event) {
     if (event->button() == Qt::LeftButton)
         m_page.Picture3_Click({event->position().x() / width(), event->position().y() / height()});
+}
+
+// The first key brings the circle to the middle.
+void RedEyeOverview::keyPressEvent(QKeyEvent* event) {
+    constexpr double step = 1.0 / 40; // of the picture; the arrows of the large picture go on from there
+    const QPoint way = event->key() == Qt::Key_Left    ? QPoint(-1, 0)
+                       : event->key() == Qt::Key_Right ? QPoint(1, 0)
+                       : event->key() == Qt::Key_Up    ? QPoint(0, -1)
+                       : event->key() == Qt::Key_Down  ? QPoint(0, 1)
+                                                       : QPoint();
+    if (way.isNull())
+        return QWidget::keyPressEvent(event);
+    const RedEyeSight& sight = m_page.sight();
+    const QPointF here(static_cast<double>(sight.RedSearchX) / sight.picture.width,
+                       static_cast<double>(sight.RedSearchY) / sight.picture.height);
+    const QPointF there = m_page.controls().RedTargetRectangle.visible ? here + step * QPointF(way) : here;
+    m_page.Picture3_Click({std::clamp(there.x(), 0.0, 1.0), std::clamp(there.y(), 0.0, 1.0)});
 }
 
 RedEyeSteps::RedEyeSteps(const Theme& theme, QWidget* parent)

@@ -76,8 +76,10 @@ void PaletteBar::keyPressEvent(QKeyEvent* event) {
     if (step == 0 || fields() == 0)
         return QWidget::keyPressEvent(event);
     const int middle = m_palette.height() / 2;
-    const int field = std::clamp(chosenField() + step, 0, fields() - 1);
-    m_pressed({field * m_palette.height() + middle, middle});
+    const QPoint pixel(std::clamp(chosenField() + step, 0, fields() - 1) * m_palette.height() + middle, middle);
+    m_chosen = m_palette.pixel(pixel); // the next key may come before the page is drawn
+    update();
+    m_pressed(pixel);
 }
 
 } // namespace lumora

@@ -18,6 +18,7 @@ public:
     PaletteBar(const Theme& theme, std::function<void(QPoint)> pressed, QWidget* parent);
     // chosen: the colour that is marked, if a field has it.
     void show(const QImage& palette, QRgb chosen);
+    int fields() const;
 
 protected:
     void paintEvent(QPaintEvent* event) override;
@@ -25,7 +26,6 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
-    int fields() const;
     int chosenField() const;
     void press(QPointF at);
 
