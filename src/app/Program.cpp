@@ -1,6 +1,7 @@
 #include "app/Program.h"
 
 #include "app/PageRegister.h"
+#include "app/UsualPlaces.h"
 #include "common/HostFile.h"
 #include "common/Warning.h"
 #include "kiosk/IdleEnd.h"
@@ -22,6 +23,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/lab/LabFile.h"
+#include "station/KeptLog.h"
 #include "transfer/waiting/WaitingSending.h"
 #include "views/window/KioskPanels.h"
 #include "views/window/MainWindow.h"
@@ -39,18 +41,6 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-// Beside this program, or where a build has it.
-HostPath doorProgram() {
-    const HostPath here = toHostPath(QCoreApplication::applicationDirPath());
-    std::error_code none;
-    const HostPath beside = here / "lumora-door";
-    return std::filesystem::exists(beside, none) ? beside : here / "../../tools/door/lumora-door";
-}
-
-} // namespace
 
 // Each member uses only those above it, as it is made.
 struct Program::Parts {
@@ -144,28 +134,27 @@ void bringForward(QWidget& window) {
 Program::Program(ProgramOptions options)
     : m_options(std::move(options)) {}
 
-Program::~Program() = default;
+Program::~Program() {
+    writeLog(u"end"_s);
+}
 
 Result<void> Program::start() {
     assert(!m_parts);
-    std::optional<HostPath> labFile = m_options.labFile;
-    if (!labFile)
-        labFile = FindLabFile(labFilePlaces(toHostPath(QCoreApplication::applicationDirPath())));
+    const std::optional<HostPath> labFile = usedLabFile(m_options);
     LabFileReading reading;
     if (labFile)
         reading = ReadLabFile(*labFile);
     for (const QString& warning : reading.warnings)
         writeWarning(warning);
+    if (reading.deployment.KeepLog)
+        m_log = std::make_unique<KeptLog>();
+    writeLog(u"start: lumora %1, Qt %2"_s.arg(QStringLiteral(LUMORA_VERSION), QString::fromLatin1(qVersion())));
     if (!reading.errors.isEmpty())
         return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
     if (m_options.operatorArea)
         reading.deployment.OperatorArea = true;
 
-    HostPath dataFolder = Drives::defaultDataFolder();
-    if (m_options.dataFolder)
-        dataFolder = *m_options.dataFolder;
-    else if (!reading.deployment.dataFolder.isEmpty())
-        dataFolder = toHostPath(reading.deployment.dataFolder);
+    const HostPath dataFolder = usedDataFolder(m_options, reading.deployment);
     std::error_code error;
     const bool made = std::filesystem::create_directories(dataFolder, error);
     if (error) {
@@ -206,6 +195,8 @@ Result<void> Program::start() {
         if (!kept)
             writeWarning(u"an order that was kept long enough can't be removed: %1"_s.arg(kept.failure().message));
     });
+    QObject::connect(&parts.chain, &PageChain::shown, &parts.window,
+                     [](const Page* page) { writeLog(u"page "_s + pageName(page->id())); });
     registerViews(parts.window, parts.chain, parts.state, parts.files);
     // A question may run an event loop of its own; each of them has to return before the process ends.
     QObject::connect(

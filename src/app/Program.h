@@ -13,6 +13,7 @@
 namespace lumora {
 
 class Internet;
+class KeptLog;
 class MainWindow;
 class PageChain;
 class ScreenDialogs;
@@ -57,6 +58,7 @@ public:
 private:
     struct Parts;
     ProgramOptions m_options;
+    std::unique_ptr<KeptLog> m_log;
     std::unique_ptr<Parts> m_parts;
     bool m_otherCameForward = false;
 };

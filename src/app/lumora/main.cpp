@@ -1,5 +1,6 @@
 #include "app/CodePrompt.h"
 #include "app/Program.h"
+#include "app/StationCommands.h"
 #include "imaging/PictureMemory.h"
 #include "session/lab/LabFile.h"
 #include "views/window/Application.h"
@@ -59,11 +60,12 @@ int main(int argc, char** argv) {
     keepPictureMemory();
     if (std::any_of(argv + 1, argv + argc, [](const char* word) { return qstrcmp(word, "--kiosk-code") == 0; }))
         return promptForStaffCode();
-    // Help needs no screen.
-    const auto asksForHelp = [](const char* word) {
-        return QByteArrayList{"-h", "--help", "-v", "--version"}.contains(QByteArray(word));
+    // These need no screen.
+    const auto showsNoPage = [](const char* word) {
+        return QByteArrayList{"-h", "--help", "-v", "--version", "--check", "--support", "--keys"}.contains(
+            QByteArray(word).split('=').first());
     };
-    if (std::any_of(argv + 1, argv + argc, asksForHelp))
+    if (std::any_of(argv + 1, argv + argc, showsNoPage))
         qputenv("QT_QPA_PLATFORM", "offscreen");
     const QtMessageHandler usual = qInstallMessageHandler(tellNoScreen);
     Application application(argc, argv);
@@ -78,7 +80,15 @@ int main(int argc, char** argv) {
     const QCommandLineOption area(u"operator"_s, u"Open the hidden area of the sending page, for the lab's people."_s);
     const QCommandLineOption code(u"kiosk-code"_s,
                                   u"Ask for the code of a kiosk's staff and print its line for lab.ini, [Kiosk]."_s);
-    parser.addOptions({help, version, lab, window, area, code});
+    const QCommandLineOption check(
+        u"check"_s,
+        u"Try the lab's file, the disk, the fonts, the clock and the lab's server, and tell what to mend."_s);
+    const QCommandLineOption write(u"write"_s, u"With --check: put a probe file on the server and delete it."_s);
+    const QCommandLineOption support(
+        u"support"_s, u"Write FILE, a ZIP file for whoever helps: versions, settings without passwords, log, orders."_s,
+        u"FILE"_s);
+    const QCommandLineOption keys(u"keys"_s, u"Print every key of lab.ini and what it allows."_s);
+    parser.addOptions({help, version, lab, window, area, code, check, write, support, keys});
     if (!parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty()) {
         std::fprintf(stderr, "lumora: %s\n",
                      qPrintable(parser.errorText().isEmpty()
@@ -98,6 +108,16 @@ int main(int argc, char** argv) {
     ProgramOptions options;
     if (parser.isSet(lab))
         options.labFile = toHostPath(parser.value(lab));
+    if (parser.isSet(write) && !parser.isSet(check)) {
+        std::fputs("lumora: --write goes with --check\n", stderr);
+        return notStarted;
+    }
+    if (parser.isSet(keys))
+        return printLabKeys();
+    if (parser.isSet(check))
+        return checkStation(options, parser.isSet(write));
+    if (parser.isSet(support))
+        return writeSupportBundle(options, toHostPath(parser.value(support)));
     options.fullScreen = !parser.isSet(window);
     options.operatorArea = parser.isSet(area);
     Program program(std::move(options));

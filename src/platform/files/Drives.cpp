@@ -1,5 +1,7 @@
 #include "platform/files/Drives.h"
 
+#include "platform/files/UserFolders.h"
+
 #include <QStringList>
 
 #include <pwd.h>
@@ -76,19 +78,7 @@ std::vector<HostPath> Drives::defaultMediaRoots() {
 }
 
 HostPath Drives::defaultDataFolder() {
-    const auto variable = [](const char* name) {
-        const char* value = std::getenv(name);
-        return value ? HostPath(value) : HostPath();
-    };
-    HostPath base = variable("XDG_DATA_HOME");
-    if (!base.is_absolute()) {
-        HostPath home = variable("HOME");
-        const passwd* user = ::getpwuid(::getuid());
-        if (home.empty() && user && user->pw_dir)
-            home = user->pw_dir;
-        base = home / ".local" / "share";
-    }
-    return base / "lumora" / "drive_c";
+    return userFolder("XDG_DATA_HOME", ".local/share") / "lumora" / "drive_c";
 }
 
 DrivePath Drives::programRoot() const {

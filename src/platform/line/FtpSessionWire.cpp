@@ -2,8 +2,10 @@
 
 #include "common/AnsiCodePage.h"
 #include "common/HostFile.h"
+#include "common/StationLog.h"
 #include "platform/line/FtpListing.h"
 
+#include <QElapsedTimer>
 #include <QRegularExpression>
 
 #include <Poco/Exception.h>
@@ -96,7 +98,9 @@ int passivePort(const QByteArray& text) {
 
 Failure FtpSessionWire::broken(Failure::Kind kind, const QString& reason) {
     close();
-    return {kind, u"ftp %1: %2"_s.arg(m_host, reason)};
+    Failure failure{kind, u"ftp %1: %2"_s.arg(m_host, reason)};
+    writeLog(u"ftp connection given up"_s, failure);
+    return failure;
 }
 
 Failure FtpSessionWire::refused(const Reply& reply) {
@@ -185,8 +189,14 @@ FtpSessionWire::Reply FtpSessionWire::readReply() {
 FtpSessionWire::Reply FtpSessionWire::ask(const QByteArray& line) {
     if (!m_open)
         throw Poco::Net::ConnectionResetException("the connection is closed");
+    QElapsedTimer timer;
+    timer.start();
     send(line);
-    return readReply();
+    const Reply reply = readReply();
+    // Only the word: what follows it is a password, or a name.
+    writeLog(
+        u"ftp %1 %2, %3 ms"_s.arg(QString::fromLatin1(line.split(' ').first())).arg(reply.code).arg(timer.elapsed()));
+    return reply;
 }
 
 Result<void> FtpSessionWire::open(const QString& host, const QString& user, const QString& password,
@@ -198,6 +208,7 @@ Result<void> FtpSessionWire::open(const QString& host, const QString& user, cons
         m_open = true;
         m_control.socket.setNoDelay(true);
         Reply greeting = readReply();
+        writeLog(u"ftp connected, %1"_s.arg(greeting.code));
         for (int delays = 0; greeting.code >= 100 && greeting.code < 200 && delays < mostDelays; ++delays)
             greeting = readReply();
         auto result = completed(greeting.code) ? login(user, password) : refusedLogin(greeting);
@@ -363,6 +374,8 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
         m_call.check();
     }
 
+    QElapsedTimer timer;
+    timer.start();
     Result<void> moved;
     try {
         moved = move(data.socket);
@@ -386,6 +399,9 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
     }
     const Reply end = readReply();
     m_transferCode = end.code;
+    writeLog(u"ftp %1 ended with %2, %3 ms"_s.arg(QString::fromLatin1(line.split(' ').first()))
+                 .arg(end.code)
+                 .arg(timer.elapsed()));
     if (!completed(end.code))
         return refused(end);
     return direction == Direction::Up ? endOfPut(data.socket) : noFailure();

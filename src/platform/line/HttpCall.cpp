@@ -1,6 +1,9 @@
 #include "platform/line/HttpCall.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/StationLog.h"
+
+#include <QElapsedTimer>
 
 #include <Poco/Exception.h>
 #include <Poco/Net/HTTPBasicCredentials.h>
@@ -155,9 +158,16 @@ Result<HttpAnswer> ask(QString url, const Asking& asking, const LineCall& line, 
         const auto to = addressOf(url);
         if (!to)
             return to.failure();
+        QElapsedTimer timer;
+        timer.start();
         const auto answer = askOnce(url, *to, asking, line, sink);
-        if (!answer)
+        // Without the address: a report's holds the customer's name.
+        const QString step = u"http %1"_s.arg(QString::fromStdString(asking.method));
+        if (!answer) {
+            writeLog(step, answer.failure());
             return answer.failure();
+        }
+        writeLog(u"%1 %2, %3 ms"_s.arg(step).arg(answer->status).arg(timer.elapsed()));
         if (!answer->next)
             return HttpAnswer(*answer);
         url = *answer->next;

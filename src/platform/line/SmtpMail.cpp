@@ -37,23 +37,9 @@ Context::Ptr verifyingContext() {
     return new Context(Context::TLS_CLIENT_USE, params);
 }
 
-quint16 portOf(const MailAccount& account) {
-    if (account.port != 0)
-        return account.port;
-    switch (account.encryption) {
-    case MailEncryption::None:
-        return 25;
-    case MailEncryption::StartTls:
-        return 587;
-    case MailEncryption::Tls:
-        return 465;
-    }
-    return 25;
-}
-
 StreamSocket connected(const MailAccount& account, const TimeLimits& limits) {
     const std::string host = account.host.toStdString();
-    const Poco::Net::SocketAddress address(host, portOf(account));
+    const Poco::Net::SocketAddress address(host, SmtpPort(account));
     if (account.encryption != MailEncryption::Tls) {
         StreamSocket socket;
         socket.connect(address, limits.connect);
@@ -230,6 +216,20 @@ MailOutcome sendNow(const MailAccount& account, const MailMessage& message, cons
 }
 
 } // namespace
+
+quint16 SmtpPort(const MailAccount& account) {
+    if (account.port != 0)
+        return account.port;
+    switch (account.encryption) {
+    case MailEncryption::None:
+        return 25;
+    case MailEncryption::StartTls:
+        return 587;
+    case MailEncryption::Tls:
+        return 465;
+    }
+    return 25;
+}
 
 MailOutcome SmtpMail::send(const MailAccount& account, const MailMessage& message) {
     return RunBlocking([&]() -> MailOutcome {

@@ -36,6 +36,7 @@ struct Deployment {
     bool OperatorArea = true;
     bool OperatorEditor = false;
     bool Waiting = false; // orders that did not arrive are sent by themselves while nobody is at the start page
+    bool KeepLog = false; // steps, codes and times, for those who look after the station
     ScreenKeys screenKeys = ScreenKeys::Never;
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;

@@ -1,6 +1,7 @@
 #include "session/lab/LabFile.h"
 
 #include "common/AnsiCodePage.h"
+#include "platform/files/UserFolders.h"
 #include "session/lab/IniReader.h"
 #include "session/lab/LabKeys.h"
 
@@ -144,10 +145,7 @@ LabFileReading ReadLabFile(const HostPath& file) {
 }
 
 std::vector<HostPath> labFilePlaces(const HostPath& programFolder) {
-    const QByteArray config = qgetenv("XDG_CONFIG_HOME");
-    // The base folder counts only when it is a whole path.
-    const HostPath configFolder =
-        config.startsWith('/') ? HostPath(config.toStdString()) : HostPath(qgetenv("HOME").toStdString()) / ".config";
+    const HostPath configFolder = userFolder("XDG_CONFIG_HOME", ".config");
     return {programFolder / "lab.ini", "/etc/lumora/lab.ini", configFolder / "lumora" / "lab.ini"};
 }
 

@@ -267,6 +267,8 @@ std::vector<Row> rows() {
         {"Kiosk", "KeepDays", number(at(&KioskRules::keepDays), 1, 9999)},
         {"Kiosk", "KeepLogDays", number(at(&KioskRules::keepLogDays), 1, 9999)},
 
+        {"Log", "Keep", yesNo(at(&D::KeepLog), true, false)},
+
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
         {"Drives", "DataFolder",
          text(at(&D::dataFolder), u"the whole path of a folder, beginning with /, or empty"_s, u"(?s)(/.*)?"_s)},

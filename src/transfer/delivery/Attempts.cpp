@@ -1,8 +1,11 @@
 #include "transfer/delivery/Attempts.h"
 
+#include "common/StationLog.h"
 #include "platform/Machine.h"
 
 namespace lumora {
+
+using namespace Qt::StringLiterals;
 
 void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const SendingStop& stop) {
     for (int round = 1; round <= rounds && !stop.left && !stop.StopFlag; ++round) {
@@ -13,6 +16,7 @@ void pauseInRounds(int rounds, SendingEvents& events, EventPump& pump, const Sen
 
 std::optional<SendingPhase> Attempts::run(int attempts, SendingMoment beginning) {
     for (int attempt = 1; attempt <= attempts; ++attempt) {
+        writeLog(u"sending: attempt %1"_s.arg(attempt));
         m_events.reached(beginning, attempt);
         const std::optional<SendingPhase> ended = sendMissing(attempt);
         if (m_stop.left)

@@ -1,5 +1,6 @@
 #include "transfer/delivery/SendingPage.h"
 
+#include "common/StationLog.h"
 #include "order/CompletenessGuard.h"
 #include "order/KeptWork.h"
 #include "order/LeftOutPictures.h"
@@ -204,6 +205,7 @@ void SendingPage::change() {
 
 void SendingPage::enter(SendingPhase phase) {
     m_phase = phase;
+    writeLog(u"sending %1: %2"_s.arg(OrderFolder::chosen(m_state).name(), phaseName(phase)));
     if (isUnderWay(phase))
         endWayBack();
     readPrints();
@@ -311,6 +313,7 @@ SendingGauge SendingPage::gauge() const {
 
 void SendingPage::tellReason(LineStep step, const Failure& failure, const QString& subject) {
     m_trouble = {step, failure, subject};
+    writeLog(u"sending: failure %1"_s.arg(LineErrorNumber(failure.kind)), failure);
     m_reason = LineTroubleText(m_state, step, failure, subject);
     m_shown.Label4Reason.text = m_reason;
     m_shown.Label4Reason.hint = failure.message;

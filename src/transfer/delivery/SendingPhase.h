@@ -26,6 +26,9 @@ enum class SendingPhase {
     NumberTaken, // the order's name is another order's on the server; it is prepared again, and the page is left
 };
 
+// For the station's log.
+QString phaseName(SendingPhase phase);
+
 constexpr bool isUnderWay(SendingPhase phase) {
     return phase == SendingPhase::Sending || phase == SendingPhase::Checking || phase == SendingPhase::Reporting;
 }

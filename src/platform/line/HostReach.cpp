@@ -1,0 +1,32 @@
+#include "platform/line/HostReach.h"
+
+#include "platform/line/LineSocket.h"
+
+#include <QUrl>
+
+#include <Poco/Exception.h>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+Result<void> ReachHost(const QString& host, quint16 usualPort, const TimeLimits& limits) {
+    const QString asked = host.contains(u"://"_s) ? QUrl(host).authority() : host;
+    const auto failed = [&](Failure::Kind kind, const QString& reason) {
+        return Failure{kind, u"%1: %2"_s.arg(asked, reason)};
+    };
+    LineAbort line;
+    const LineCall call(limits, line);
+    try {
+        LineSocket(ResolvedAddress(asked.toStdString(), usualPort, call), call).close();
+        return {};
+    } catch (const Poco::TimeoutException&) {
+        return failed(Failure::Kind::TimedOut, u"no answer within the time limit"_s);
+    } catch (const Poco::Exception& exception) {
+        return failed(Failure::Kind::Disconnected, QString::fromStdString(exception.displayText()));
+    } catch (const std::exception& exception) {
+        return failed(Failure::Kind::Other, QString::fromLocal8Bit(exception.what()));
+    }
+}
+
+} // namespace lumora

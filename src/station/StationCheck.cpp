@@ -1,0 +1,276 @@
+#include "station/StationCheck.h"
+
+#include "common/HostFile.h"
+#include "editing/render/FrameLists.h"
+#include "imaging/drawing/Drawing.h"
+#include "platform/line/HostReach.h"
+#include "platform/line/SmtpMail.h"
+#include "session/Workspace.h"
+#include "session/lab/ClientProfile.h"
+
+#include <QDateTime>
+#include <QFontDatabase>
+#include <QTemporaryDir>
+
+#include <sys/timex.h>
+
+#include <algorithm>
+
+namespace lumora {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+using enum CheckLine::State;
+
+// Bytes. An order of 300 pictures takes about one and a half gigabytes while it is prepared.
+constexpr qint64 littleSpace = 5'000'000'000;
+constexpr qint64 noSpace = 500'000'000;
+
+constexpr quint16 httpPort = 80;
+
+QString gigabytes(qint64 bytes) {
+    return u"%1 GB"_s.arg(static_cast<double>(bytes) / 1e9, 0, 'f', 1);
+}
+
+// The line ends of the probe grow or shrink on a server that changes what it takes.
+const QByteArray probe = "a line\nanother\r\nthe last\r";
+
+QString connectAdvice(Failure::Kind kind) {
+    switch (kind) {
+    case Failure::Kind::Unsupported:
+        return u"the lab's server wants encryption; ask the lab for an account that does without"_s;
+    case Failure::Kind::Refused:
+        return u"compare [Server] User and Password with what the lab has given out"_s;
+    default:
+        return u"is this machine on line, and is [Server] Host right? A firewall may hold port 21"_s;
+    }
+}
+
+} // namespace
+
+StationCheck::StationCheck(const LabFileReading& lab, const HostPath& dataFolder, const HostPath& doorProgram,
+                           Internet& line, Tell tell)
+    : m_lab(lab)
+    , m_dataFolder(dataFolder)
+    , m_doorProgram(doorProgram)
+    , m_drives(dataFolder, lab.deployment.programLetter)
+    , m_files(m_drives)
+    , m_line(line)
+    , m_tell(std::move(tell)) {
+    m_state.DiskRoot = m_drives.programRoot();
+    LoadDefaultProfile(m_state, lab.deployment);
+}
+
+void StationCheck::tell(CheckLine::State state, const QString& subject, const QString& text, const QString& advice) {
+    m_good = m_good && state != Fault;
+    m_tell({state, subject, text, advice});
+}
+
+bool StationCheck::run(const HostPath& labFile, Server server) {
+    checkLabFile(labFile);
+    checkDisk();
+    checkFrames();
+    checkFonts();
+    checkDoor();
+    checkClock();
+    if (!m_lab.errors.isEmpty()) {
+        tell(Look, u"server"_s, u"not tried, since the lab's file can't be used"_s);
+        return false;
+    }
+    checkHosts();
+    if (m_lab.deployment.TachanaMekomit)
+        tell(Good, u"server"_s, u"none: a local station keeps its orders"_s);
+    else
+        checkServer(server);
+    return m_good;
+}
+
+void StationCheck::checkLabFile(const HostPath& labFile) {
+    if (labFile.empty()) {
+        tell(Look, u"lab.ini"_s, u"there is none, the built-in values hold"_s,
+             u"\"lumora --help\" names where it may lie; /usr/share/doc/lumora has an example"_s);
+        return;
+    }
+    for (const QString& error : m_lab.errors)
+        tell(Fault, u"lab.ini"_s, error, u"the program does not start before this line is right"_s);
+    for (const QString& warning : m_lab.warnings)
+        tell(Fault, u"lab.ini"_s, warning);
+    if (m_lab.errors.isEmpty() && m_lab.warnings.isEmpty())
+        tell(Good, u"lab.ini"_s, toText(labFile));
+    if (m_lab.errors.isEmpty() && !m_lab.deployment.Careful)
+        tell(Look, u"guards"_s, u"[Guards] Careful is no: an order can be lost where the built-in behaviour loses it"_s,
+             u"set [Guards] Careful = yes"_s);
+}
+
+void StationCheck::checkDisk() {
+    std::error_code error;
+    std::filesystem::create_directories(m_dataFolder, error);
+    const QTemporaryDir written(toText(m_dataFolder) + u"/.check-XXXXXX"_s);
+    const QString folder = toText(m_dataFolder);
+    if (!written.isValid()) {
+        tell(Fault, u"data folder"_s, u"%1: nothing can be written there: %2"_s.arg(folder, written.errorString()),
+             u"give the program's user the right to write there, or name another folder with [Drives] DataFolder"_s);
+        return;
+    }
+    const Result<qint64> free = m_files.freeBytes(m_state.DiskRoot);
+    if (!free) {
+        tell(Fault, u"data folder"_s, free.failure().message);
+        return;
+    }
+    const QString text = u"%1, %2 are free"_s.arg(folder, gigabytes(*free));
+    if (*free >= littleSpace)
+        tell(Good, u"data folder"_s, text);
+    else
+        tell(*free < noSpace ? Fault : Look, u"data folder"_s, text,
+             u"a large order takes 1.5 GB: remove what is not needed on this disk"_s);
+}
+
+void StationCheck::checkFrames() {
+    const DrivePath folder = WorkspacePaths::misgarot(m_state);
+    const FrameLists frames(m_files, folder);
+    int count = 0;
+    for (const QString& category : frames.categories())
+        count += static_cast<int>(frames.names(category, FrameLists::ListFile::Bmp).size());
+    if (count > 0)
+        tell(Good, u"frames"_s, u"%1"_s.arg(count));
+    else
+        tell(Look, u"frames"_s, u"none: the editor offers no frame"_s,
+             u"put the lab's frames into %1, a folder for each category"_s.arg(
+                 toText(m_files.host(folder).ok() ? *m_files.host(folder) : m_dataFolder)));
+}
+
+void StationCheck::checkFonts() {
+    if (installedFamily(u"David"_s).isEmpty())
+        tell(Fault, u"fonts"_s, u"David is missing: captions and the order sheet are drawn without their text"_s,
+             u"install the package culmus"_s);
+    else if (!QFontDatabase::hasFamily(u"Noto Sans Hebrew"_s))
+        tell(Look, u"fonts"_s, u"Noto Sans Hebrew is missing: the pages take another Hebrew face"_s,
+             u"install the package fonts-noto-core"_s);
+    else
+        tell(Good, u"fonts"_s, u"those of the pages and of the prints are there"_s);
+}
+
+void StationCheck::checkDoor() {
+    if (!m_lab.deployment.door.everyFormat)
+        return;
+    std::error_code error;
+    if (std::filesystem::exists(m_doorProgram, error))
+        tell(Good, u"formats"_s, toText(m_doorProgram));
+    else
+        tell(Fault, u"formats"_s, u"%1 is missing: pictures of phones can't be ordered"_s.arg(toText(m_doorProgram)),
+             u"install the program anew, or set [Door] Formats = jpg"_s);
+}
+
+void StationCheck::checkClock() {
+    const QString now = QDateTime::currentDateTime().toString(u"yyyy-MM-dd HH:mm"_s);
+    timex answer{};
+    // adjtimex(2): without a time server the kernel tells TIME_ERROR.
+    if (::adjtimex(&answer) == TIME_ERROR)
+        tell(Look, u"clock"_s, u"%1, and no time server sets it; orders bear its day and hour"_s.arg(now),
+             u"compare it, and let it be set: timedatectl set-ntp true"_s);
+    else
+        tell(Good, u"clock"_s, now);
+}
+
+void StationCheck::checkHosts() {
+    const ClientProfile& lab = m_state.profile;
+    struct Host {
+        const char* key;
+        QString address;
+        quint16 port;
+    };
+    QList<Host> hosts;
+    const bool byHttp = m_lab.deployment.SugSheliach == Sender::Http;
+    if (lab.ReportOn > 0) {
+        hosts += {"[Addresses] Report", lab.ReportUrl, httpPort};
+        hosts += byHttp ? Host{"[Addresses] HttpDone", lab.HttpDoneUrl, httpPort}
+                        : Host{"[Addresses] Done", lab.DoneUrl, httpPort};
+    }
+    if (byHttp)
+        hosts += {"[Addresses] HttpHost", lab.HttpHost, httpPort};
+    if (lab.mail.setUp())
+        hosts += {"[Mail] Server", lab.mail.host, SmtpPort(lab.mail)};
+    for (const Host& host : hosts) {
+        const QString key = QString::fromLatin1(host.key);
+        const Result<void> reached = ReachHost(host.address, host.port);
+        if (reached)
+            tell(Good, key, u"answers at its port"_s);
+        else
+            tell(Fault, key, reached.failure().message, u"is this machine on line, and is the address right?"_s);
+    }
+}
+
+void StationCheck::checkServer(Server server) {
+    const QString subject = u"server"_s;
+    const ClientProfile& lab = m_state.profile;
+    const auto connection =
+        m_line.connectFtp(lab.FtpServer, lab.FtpUser, lab.FtpPassword, Internet::DataChannel::Passive);
+    if (!connection) {
+        tell(Fault, subject, connection.failure().message, connectAdvice(connection.failure().kind));
+        return;
+    }
+    tell(Good, subject, u"%1 answers, and takes user and password"_s.arg(lab.FtpServer));
+    for (const QString& folder : {lab.FtpFolder1, lab.FtpFolder2}) {
+        if (folder.isEmpty())
+            continue;
+        if (const auto entered = (*connection)->setCurrentDirectory(folder); !entered) {
+            tell(Fault, u"folder"_s, u"%1 can't be entered: %2"_s.arg(folder, entered.failure().message),
+                 u"compare [Server] Folder1 and Folder2 with what the lab has given out"_s);
+            return;
+        }
+    }
+    const auto listing = (*connection)->list(u"*.*"_s, EmptyFolder::MayBeRefused);
+    const QString typeAndList = u"TYPE %1 and LIST"_s.arg(m_lab.deployment.ftpType == FtpType::Ascii ? u"A"_s : u"I"_s);
+    if (!listing) {
+        tell(Fault, u"folder"_s, u"%1: %2"_s.arg(typeAndList, listing.failure().message),
+             u"without a listing no order is proven to have arrived: ask the lab"_s);
+        return;
+    }
+    if (!listing->unread.isEmpty()) {
+        tell(Fault, u"folder"_s, u"the server lists in a form that can't be read"_s,
+             u"without a listing no order is proven to have arrived: ask the lab for another form"_s);
+        return;
+    }
+    tell(Good, u"folder"_s,
+         u"%1 are taken; %2 names in the folder of the orders"_s.arg(typeAndList).arg(listing->entries.size()));
+    if (server == Server::IsWritten)
+        checkProbe(**connection);
+}
+
+void StationCheck::checkProbe(FtpConnection& connection) {
+    const QString subject = u"writing"_s;
+    const QTemporaryDir folder;
+    const HostPath file = toHostPath(folder.filePath(u"probe"_s));
+    if (const auto made = writeWholeFile(file, probe); !made) {
+        tell(Fault, subject, made.failure().message);
+        return;
+    }
+    const QString name = u"lumora-check-%1.txt"_s.arg(QDateTime::currentMSecsSinceEpoch());
+    if (const auto put = connection.put(file, name); !put) {
+        tell(Fault, subject, put.failure().message, u"the account must be allowed to make files and folders there"_s);
+        return;
+    }
+    std::optional<qint64> length;
+    if (const auto listing = connection.list(u"*.*"_s)) {
+        for (const FtpEntry& entry : listing->entries) {
+            if (entry.name == name)
+                length = entry.length;
+        }
+    }
+    const auto removed = connection.remove(name);
+    if (!length)
+        tell(Fault, subject, u"%1 was taken, and the listing does not show it with its length"_s.arg(name),
+             u"without it no order is proven to have arrived: ask the lab"_s);
+    else if (*length != probe.size())
+        tell(Fault, subject, u"the server has changed the file's line ends: each print arrives damaged"_s,
+             u"set [Server] Type = I"_s);
+    else
+        tell(Good, subject, u"a probe file arrived as it is"_s);
+    if (!removed)
+        tell(Look, subject, u"%1 can't be deleted: %2"_s.arg(name, removed.failure().message),
+             u"delete it by hand; a broken file of an order can't be deleted either"_s);
+}
+
+} // namespace lumora
