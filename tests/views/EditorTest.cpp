@@ -11,13 +11,14 @@ namespace {
 
 class EditorLook : public PageLook {
 protected:
-    // The turns are at hand and hide nothing of the paper.
-    static void expectTurnsBesidePaper(Walk& walk) {
+    // The panel is at hand and hides nothing of the paper.
+    static void expectBesidePaper(Walk& walk, const QString& panel) {
         const auto place = [&](const QString& name) {
             const QWidget& widget = walk.control(name);
             return QRect(widget.mapTo(&walk.program().window(), QPoint()), widget.size());
         };
-        EXPECT_FALSE(place(u"Frame4"_s).intersects(place(u"PicPic"_s)));
+        EXPECT_TRUE(walk.control(panel).isVisible());
+        EXPECT_FALSE(place(panel).intersects(place(u"PicPic"_s)));
     }
 };
 
@@ -42,8 +43,17 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
         EXPECT_FALSE(walk.pressable(editor, QString::fromLatin1(name))) << name;
 
     go(walk, u"Frame4Opener :31-turn"_s);
-    expectTurnsBesidePaper(walk);
-    go(walk, u"Image16 Image13 :32-tones Image11"_s);
+    expectBesidePaper(walk, u"Frame4"_s);
+    go(walk, u"Image16 Image13 :32-tones"_s);
+    expectBesidePaper(walk, u"Frame3"_s);
+    // Each press elsewhere closes the tones, and their own button does.
+    for (const char* elsewhere : {"Strip(0)", "PicPic", "Image13"}) {
+        if (!walk.pressable(editor, u"Frame3"_s))
+            go(walk, u"Image13"_s);
+        go(walk, QString::fromLatin1(elsewhere));
+        EXPECT_FALSE(walk.pressable(editor, u"Frame3"_s)) << elsewhere;
+    }
+    go(walk, u"Image13 Image11"_s);
     // The caption's keyboard lies below the picture, which stays whole and can be dragged.
     go(walk, u"Image20 Image20 Image20 :33-frame Image29 :34-hints hintsClose Command8>mikledet :37-keyboard"_s);
     const auto* paper = walk.program().window().findChild<QWidget*>(u"PicPic"_s);
@@ -56,7 +66,7 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
     go(walk, u"CommandDone>tFrmNew Strip(2)"_s);
     walk.settle(300);
     go(walk, u":35-other-picture Frame4Opener :35-turn"_s);
-    expectTurnsBesidePaper(walk);
+    expectBesidePaper(walk, u"Frame4"_s);
     go(walk, u"CommandDone>kyoskNew :36-pictures-edited"_s);
 }
 

@@ -157,10 +157,11 @@ QLayout* tFrmNewView::makeLight() {
 
 QWidget* tFrmNewView::makeFramesAndMore() {
     const Card more = makeCard("card", Pad::Tight);
-    m_tones = tool(c.Image13, u"tones"_s, narrow, &tFrmNew::Image13_MouseMove);
+    m_tones = tool(c.Image13, u"tones"_s, narrow, [this] { pressTones(); });
     m_tones->installEventFilter(this);
     more.column->addLayout(inRow(Space::Tight, {m_tones, tool(c.Command8, u"text"_s, narrow, &tFrmNew::Command8_Click),
                                                 colour(7, u"eye"_s, QColor(0xB2, 0x32, 0x2A))}));
+    m_moreTools = more.frame;
 
     m_categories = comboBox(c.Combo4List, c.Combo4, toPage(&tFrmNew::Combo4_Click));
     m_categories->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
@@ -174,7 +175,7 @@ QWidget* tFrmNewView::makeFramesAndMore() {
     QFrame* frames =
         group(c.framesTitle,
               {m_categories, {m_frames, 1}, steps, use, checkBox(c.Misgerett, toPage(&tFrmNew::Misgerett_Click))});
-    QWidget* box = inBox(inColumn(Space::Small, {more.frame, {frames, 1}}));
+    QWidget* box = inBox(inColumn(Space::Small, {m_moreTools, {frames, 1}}));
     box->setFixedWidth(theme().px(columnWidth));
     return box;
 }
@@ -293,6 +294,7 @@ void tFrmNewView::render() {
     if (!uncovered)
         m_operatorPanel->hide();
     m_resolution->display(c.resolution);
+    m_tonesPressed = m_tonesPressed && c.Frame3.visible;
     m_table->render(c.Image19.visible ? c.Image19.text : QString());
     placePanels();
 }

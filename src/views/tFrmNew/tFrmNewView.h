@@ -47,6 +47,7 @@ private:
     QLayout* makeFrameSteps();
     QWidget* makeStrip();
     void makeTonePanel();
+    void pressTones();
     void makeTurnPanel();
     void makeOperatorPanel();
     void makeHints();
@@ -73,6 +74,7 @@ private:
     EditorTable* m_table = nullptr;
     QWidget* m_nearTools = nullptr;
     QWidget* m_farTools = nullptr;
+    QFrame* m_moreTools = nullptr; // the first group of the far ones
     QWidget* m_strip = nullptr;
     QWidget* m_behindPanel = nullptr; // as high as what a panel covers
     std::array<StripCell*, cellsOfPage> m_cells{};
@@ -91,6 +93,7 @@ private:
     QPushButton* m_previous = nullptr;
     QPushButton* m_next = nullptr;
     QFrame* m_tonePanel = nullptr;
+    bool m_tonesPressed = false; // its panel was opened by a press, not by the pointer that passed
     QFrame* m_turnPanel = nullptr;
     QBoxLayout* m_turns = nullptr; // the buttons of the panel, in a row or in a column
     QFrame* m_operatorPanel = nullptr;

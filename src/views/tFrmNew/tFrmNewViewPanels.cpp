@@ -3,6 +3,7 @@
 #include "editing/render/LineFrame.h"
 #include "views/kit/CardButtons.h"
 #include "views/kit/Overlay.h"
+#include "views/kit/PressElsewhere.h"
 #include "views/kit/ToolButton.h"
 #include "views/tFrmNew/EditorPaper.h"
 #include "views/tFrmNew/tFrmNewView.h"
@@ -92,13 +93,26 @@ void tFrmNewView::makeTonePanel() {
         return made;
     };
     const Card panel = makeCard("card", Pad::Tight);
-    panel.column->addLayout(inRow(Space::Tight, {tone(c.Image5, {1, 1, 1}, false, &tFrmNew::Image5_Click),
-                                                 tone(c.Image4, {1, 1, 1}, true, &tFrmNew::Image4_Click),
-                                                 tone(c.Image11, {1.3, 1, 0.8}, true, &tFrmNew::Image11_Click),
-                                                 tone(c.Image12, {1, 1, 1.3}, true, &tFrmNew::Image12_Click),
-                                                 tone(c.Image9, {1, 1.3, 1}, true, &tFrmNew::Image9_Click)}));
+    QGridLayout* grid = inGrid(Space::Tight);
+    grid->addWidget(tone(c.Image5, {1, 1, 1}, false, &tFrmNew::Image5_Click), 0, 0, 1, 2);
+    grid->addWidget(tone(c.Image4, {1, 1, 1}, true, &tFrmNew::Image4_Click), 1, 0);
+    grid->addWidget(tone(c.Image11, {1.3, 1, 0.8}, true, &tFrmNew::Image11_Click), 1, 1);
+    grid->addWidget(tone(c.Image12, {1, 1, 1.3}, true, &tFrmNew::Image12_Click), 2, 0);
+    grid->addWidget(tone(c.Image9, {1, 1.3, 1}, true, &tFrmNew::Image9_Click), 2, 1);
+    add(*panel.column, {grid, Item::room()});
     m_tonePanel = panel.frame;
     bind(m_tonePanel, c.Frame3);
+    new PressElsewhere(*m_tonePanel, *m_tones, [this] {
+        if (!isDetached() && c.Frame3.visible)
+            m_page.Image2_MouseMove();
+    });
+}
+
+// The pointer that comes to the button has opened the panel already; the next press closes it.
+void tFrmNewView::pressTones() {
+    const bool closes = c.Frame3.visible && m_tonesPressed;
+    m_tonesPressed = !closes;
+    closes ? m_page.Image2_MouseMove() : m_page.Image13_MouseMove();
 }
 
 void tFrmNewView::makeTurnPanel() {
@@ -220,8 +234,8 @@ std::optional<PanelForms> tFrmNewView::turnForms() const {
     return forms;
 }
 
-// The operator's tools lie over the small pictures, the turns beside the paper, the tones over the table beside their
-// button.
+// The operator's tools lie over the small pictures, the turns beside the paper, the tones over the frames below their
+// button: never over the picture.
 void tFrmNewView::placePanels() {
     if (!m_operatorPanel || isDetached())
         return;
@@ -238,12 +252,10 @@ void tFrmNewView::placePanels() {
     m_turns->setDirection(turns.column ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
     m_turnPanel->setGeometry(turns.panel.translated(corner));
     m_turnPanel->raise();
-    const QSize tones = m_tonePanel->sizeHint();
-    const bool atLeft = m_tones->mapTo(this, QPoint()).x() < corner.x();
-    const int level = m_tones->mapTo(this, m_tones->rect().center()).y() - tones.height() / 2;
-    m_tonePanel->setGeometry(atLeft ? corner.x() : corner.x() + m_table->width() - tones.width(),
-                             std::clamp(level, corner.y(), corner.y() + m_table->height() - tones.height()),
-                             tones.width(), tones.height());
+    // The place of the frames as a whole.
+    const QRect tools(m_farTools->mapTo(this, QPoint()), m_farTools->size());
+    const int top = m_moreTools->height() + theme().size(Space::Small);
+    m_tonePanel->setGeometry(tools.adjusted(0, top, 0, 0));
     m_tonePanel->raise();
     if (m_hints->isOpen())
         m_hints->raise();
