@@ -1,4 +1,5 @@
 // The panel of the start page that offers an order which was not finished.
+#include "common/StationLog.h"
 #include "common/Warning.h"
 #include "order/CustomerTraces.h"
 #include "order/KioskOffer.h"
@@ -52,6 +53,7 @@ void hatchala::offerUnfinished() {
         return;
     TidyOrders(m_state, m_platform.files);
     readUnfinished();
+    writeLog(u"orders: %1 wait, %2 are offered"_s.arg(m_state.waitingOrders).arg(m_unfinished.size()));
 }
 
 // What is sent by itself is no business of the next customer.

@@ -90,7 +90,7 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
 void StationCheck::checkLabFile(const HostPath& labFile) {
     if (labFile.empty()) {
         tell(Look, u"lab.ini"_s, u"there is none, the built-in values hold"_s,
-             u"\"lumora --help\" names where it may lie; /usr/share/doc/lumora has an example"_s);
+             u"\"lumora --help\" names where it may lie; /usr/share/lumora/lab.ini.example is an example"_s);
         return;
     }
     for (const QString& error : m_lab.errors)

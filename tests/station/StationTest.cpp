@@ -4,6 +4,7 @@
 #include "common/Warning.h"
 #include "platform/line/PocoInternet.h"
 #include "station/KeptLog.h"
+#include "station/ServiceNotice.h"
 #include "station/StationCheck.h"
 #include "station/SupportBundle.h"
 #include "support/FakeLab.h"
@@ -11,10 +12,13 @@
 
 #include <QRegularExpression>
 #include <QTemporaryDir>
+#include <QTest>
+
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/un.h>
 
 #include <gtest/gtest.h>
-
-#include <sys/stat.h>
 
 namespace lumora {
 namespace {
@@ -101,6 +105,28 @@ TEST_F(StationTest, TheBundleHoldsNoSecret) {
     const QByteArray zip = contentOf(here / "help.zip");
     EXPECT_TRUE(zip.startsWith("PK") && zip.contains("orders.txt") && zip.contains("versions.txt"));
     EXPECT_FALSE(bundle.write(here / "help.zip")) << "a file that was there is gone";
+}
+
+TEST_F(StationTest, AServiceIsToldThatItHasBegunAndLives) {
+    const QByteArray name = toText(here / "notify").toUtf8();
+    const Descriptor manager(::socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0));
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    name.toStdString().copy(address.sun_path, sizeof address.sun_path - 1);
+    ASSERT_EQ(::bind(manager.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
+    qputenv("NOTIFY_SOCKET", name);
+    qputenv("WATCHDOG_USEC", "20000");
+    const ServiceNotice notice;
+    qunsetenv("WATCHDOG_USEC");
+    EXPECT_FALSE(qEnvironmentVariableIsSet("NOTIFY_SOCKET"));
+    QByteArray told;
+    std::array<char, 64> bytes;
+    for (int looks = 0; looks < 500 && !told.endsWith("WATCHDOG=1"); ++looks) {
+        QTest::qWait(10);
+        const auto count = ::recv(manager.number(), bytes.data(), bytes.size(), MSG_DONTWAIT);
+        told += QByteArray(bytes.data(), std::max<qsizetype>(count, 0));
+    }
+    EXPECT_EQ(told, "READY=1WATCHDOG=1");
 }
 
 // The station of a loopback lab: what is told of each subject.

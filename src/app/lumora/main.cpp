@@ -3,6 +3,7 @@
 #include "app/StationCommands.h"
 #include "imaging/PictureMemory.h"
 #include "session/lab/LabFile.h"
+#include "station/ServiceNotice.h"
 #include "views/window/Application.h"
 #include "views/window/StartFailure.h"
 
@@ -127,5 +128,6 @@ int main(int argc, char** argv) {
             showStartFailure(started.failure().message);
         return started.failure().kind == Failure::Kind::InUse ? alreadyRunning : notStarted;
     }
+    const ServiceNotice notice;
     return QCoreApplication::exec();
 }

@@ -1,0 +1,37 @@
+# lab.ini(5). First file: what "lumora --keys" prints, "[Section]" and "Key: what it allows". Second: the example, whose comments stand
+# above the keys that they explain.
+function roff(text) {
+  gsub(/\\/, "\\e", text)
+  gsub(/-/, "\\-", text)
+  sub(/^[.']/, "\\\\\\&&", text)
+  return text
+}
+FNR == NR && /^\[/ { section = $0; next }
+FNR == NR && /: / { allowed[section $0] = ""; key = $0; sub(/:.*/, "", key); sub(/^[^:]*: /, ""); allowed[section key] = $0; next }
+FNR == NR { next }
+FNR == 1 {
+  print ".TH LAB.INI 5 \"\" \"Lumora\" \"File formats\""
+  print ".SH NAME\nlab.ini \\- what a photo lab decides for one machine with lumora(1)"
+  print ".SH DESCRIPTION"
+  sub(/^# lab.ini: /, "# This file holds ")
+}
+/^#/ { sub(/^# ?/, ""); words = words roff($0) "\n"; next }
+/^\[/ {
+  printf "%s", words
+  words = ""
+  section = $0
+  print ".SH " roff(section)
+  next
+}
+/^[A-Za-z0-9]+ *=/ {
+  key = value = $0
+  sub(/ *=.*/, "", key)
+  sub(/^[^=]*= */, "", value)
+  print ".TP\n.B " roff(key)
+  if (section key in allowed) print "Allowed: " roff(allowed[section key]) (value == "" ? "." : "; as in\n.IR \"" roff(value) "\" .")
+  printf "%s", words
+  words = ""
+  next
+}
+/^$/ && words != "" { printf "%s", words; words = "" }
+END { print ".SH SEE ALSO\nlumora(1)" }
