@@ -13,12 +13,14 @@
 #include <QAbstractItemModel>
 #include <QAbstractScrollArea>
 #include <QAccessible>
+#include <QCheckBox>
 #include <QComboBox>
 #include <QImage>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
 #include <QPushButton>
+#include <QRegularExpression>
 #include <QScrollArea>
 
 #include <algorithm>
@@ -36,6 +38,61 @@ bool hasHebrew(const QString& text) {
 
 QString nameOf(const QWidget& widget) {
     return u"%1 \"%2\""_s.arg(QString::fromLatin1(widget.metaObject()->className()), widget.objectName());
+}
+
+QString nameOf(QAccessibleInterface& node) {
+    return u"%1 \"%2\""_s.arg(QString::fromLatin1(node.object()->metaObject()->className()),
+                              node.object()->objectName());
+}
+
+// What the keyboard can come to behind the panel.
+void behind(QAccessibleInterface* node, const QWidget& panel, QStringList& faults) {
+    const auto* widget = node ? qobject_cast<QWidget*>(node->object()) : nullptr;
+    if (!widget || node->state().invisible)
+        return;
+    const bool apart = widget != &panel && !panel.isAncestorOf(widget) && !widget->isAncestorOf(&panel) &&
+                       widget->focusPolicy() != Qt::NoFocus;
+    if (apart)
+        faults += u"a screen reader finds what a panel covers: "_s + nameOf(*widget);
+    for (int i = 0; i < node->childCount(); ++i)
+        behind(node->child(i), panel, faults);
+}
+
+// Buttons by their roles. What can be chosen excludes its neighbours, but for boxes to tick, the key of capitals and
+// the switch of the language.
+void rolesOf(QAccessibleInterface* node, QStringList& faults) {
+    if (!node || !node->object() || node->state().invisible)
+        return;
+    if (const auto* button = qobject_cast<QAbstractButton*>(node->object())) {
+        const bool box = qobject_cast<const QCheckBox*>(button);
+        const bool keys = button->objectName() == u"keyCapitals"_s || button->objectName() == u"Check1"_s;
+        const bool choice = !box && button->isCheckable() && !keys;
+        const QAccessible::Role role = node->role();
+        if (choice ? role != QAccessible::RadioButton
+                   : role != QAccessible::Button && role != QAccessible::CheckBox && role != QAccessible::RadioButton)
+            faults += u"%1 has the role %2"_s.arg(nameOf(*node)).arg(role);
+        if (button->isCheckable() && (!node->state().checkable || node->state().checked != button->isChecked()))
+            faults += u"a screen reader hears another mark than %1 shows"_s.arg(nameOf(*node));
+    }
+    for (int i = 0; i < node->childCount(); ++i)
+        rolesOf(node->child(i), faults);
+}
+
+// Named in another language than the page has. In Hebrew a name or a number may stand in Latin letters where it is
+// shown so.
+void foreignNames(QAccessibleInterface* node, bool english, QStringList& faults) {
+    if (!node || !node->object() || node->state().invisible || node->object()->property("letterOfAnyLanguage").toBool())
+        return;
+    const QString name = node->text(QAccessible::Name);
+    const auto* button = qobject_cast<QAbstractButton*>(node->object());
+    static const QRegularExpression latinWord(u"[A-Za-z]{3,}"_s), data(u"\\.\\w+$|@"_s);
+    const bool shown = !button || isolated(button->text()).contains(isolated(name));
+    if (english ? hasHebrew(name) : !shown && !hasHebrew(name) && name.contains(latinWord) && !name.contains(data))
+        faults += u"%1 is called \"%2\""_s.arg(nameOf(*node), name);
+    if (node->role() == QAccessible::ComboBox || node->role() == QAccessible::List)
+        return; // rows are data
+    for (int i = 0; i < node->childCount(); ++i)
+        foreignNames(node->child(i), english, faults);
 }
 
 void unnamed(QAccessibleInterface* node, QStringList& faults) {
@@ -129,8 +186,22 @@ QStringList pageFaults(Program& program) {
     QStringList result;
     MainWindow& window = program.window();
     unnamed(QAccessible::queryAccessibleInterface(&window), result);
+    QAccessibleInterface* const spoken = QAccessible::queryAccessibleInterface(&window);
+    rolesOf(spoken, result);
+    foreignNames(spoken, english, result);
     const Overlay* panel = frontOverlay(window);
+    if (panel) {
+        QAccessibleInterface* const box = QAccessible::queryAccessibleInterface(const_cast<Overlay*>(panel));
+        const bool told = panel->objectName() == u"messagePanel"_s && !panel->findChild<QWidget*>(u"messageNo"_s);
+        if (box->role() != (told ? QAccessible::AlertMessage : QAccessible::Dialog) &&
+            (told || box->role() != QAccessible::AlertMessage))
+            result += u"the panel has the role %1"_s.arg(box->role());
+        if (box->text(QAccessible::Name).isEmpty())
+            result += u"the panel has no name"_s;
+    }
     const auto* keys = window.findChild<TouchKeyboard*>();
+    if (panel && !(keys && keys->isVisible()))
+        behind(spoken, *panel, result);
     const QWidget* root = keys && keys->isVisible() ? static_cast<const QWidget*>(keys)
                           : panel                   ? static_cast<const QWidget*>(panel)
                                                     : window.frontView();

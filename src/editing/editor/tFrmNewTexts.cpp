@@ -77,8 +77,8 @@ void tFrmNew::setTexts() {
     setWordings(m_state, {
                              {words.categories, u"קטגוריית המסגרות", u"Category of frames"},
                              {words.framesOfCategory, u"המסגרות של הקטגוריה", u"Frames of the category"},
-                             {words.operatorPanel, u"Operator"},
-                             {words.lineStyles, u"Line style"},
+                             {words.operatorPanel, u"כלי המפעיל", u"Operator"},
+                             {words.lineStyles, u"סגנון הקו", u"Line style"},
                              {words.emptyCell, u"תא ריק", u"Empty place"},
                              {words.openCell, u"%1, פתוחה לעריכה", u"%1, open for editing"},
                              {words.otherCell, u"%1, לחיצה פותחת לעריכה", u"%1, press to edit"},

@@ -1,6 +1,7 @@
 #include "views/kit/ChoiceCards.h"
 
 #include "views/kit/CardButtons.h"
+#include "views/kit/ScreenReader.h"
 #include "views/kit/Theme.h"
 
 #include <QGridLayout>
@@ -29,6 +30,7 @@ void ChoiceCards::display(const QStringList& rows, int current) {
         CardButton* card = m_maker(row);
         card->setParent(this);
         card->setCheckable(true);
+        excludeOthers(*card);
         card->setObjectName(u"%1(%2)"_s.arg(objectName()).arg(row));
         connect(card, &QAbstractButton::clicked, this, [this, row] { Q_EMIT activated(row); });
         m_grid->addWidget(card, row / m_columns, row % m_columns);

@@ -1,5 +1,7 @@
 #include "views/kit/Maker.h"
 
+#include "views/kit/ScreenReader.h"
+
 #include <QPainter>
 #include <QStyle>
 #include <QStyleOption>
@@ -11,6 +13,18 @@
 namespace lumora {
 
 namespace {
+
+// A card that shows only where something went wrong.
+class CardFrame : public QFrame {
+public:
+    using QFrame::QFrame;
+
+protected:
+    void showEvent(QShowEvent* event) override {
+        QFrame::showEvent(event);
+        tellAlert(*this);
+    }
+};
 
 // Draws its words as the page reads, whatever letter they begin with; the text itself stays as it was set.
 class PageLabel : public QLabel {
@@ -112,7 +126,11 @@ void setRole(QWidget* widget, const char* role) {
 }
 
 void changeRole(QWidget* widget, const char* role) {
+    if (widget->property("role") == QString::fromLatin1(role))
+        return;
     changeLook(widget, "role", QString::fromLatin1(role));
+    if (widget->isVisible())
+        tellAlert(*widget);
 }
 
 void changeLook(QWidget* widget, const char* property, const QVariant& value) {
@@ -179,7 +197,7 @@ QWidget* Maker::inMiddle(QWidget* inside, int share) const {
 }
 
 Card Maker::makeCard(const char* role, Pad pad, Space gap) const {
-    auto* frame = new QFrame(m_parent);
+    auto* frame = new CardFrame(m_parent);
     setRole(frame, role);
     QVBoxLayout* column = inColumn(gap);
     column->setContentsMargins(m_theme.margins(pad));

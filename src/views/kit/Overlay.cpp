@@ -1,6 +1,7 @@
 #include "views/kit/Overlay.h"
 
 #include "views/kit/Keyboard.h"
+#include "views/kit/ScreenReader.h"
 
 #include <QApplication>
 #include <QEvent>
@@ -67,6 +68,7 @@ void Overlay::setOpen(bool open) {
         show();
         raise();
         place();
+        tellAlert(*this);
         (m_firstFocus ? m_firstFocus.data() : this)->setFocus(Qt::OtherFocusReason);
     } else {
         const bool hadFocus = isAncestorOf(QApplication::focusWidget()) || QApplication::focusWidget() == this;

@@ -1,5 +1,6 @@
 #include "views/window/Application.h"
 
+#include "views/kit/ScreenReader.h"
 #include "views/kit/Theme.h"
 
 #include <cstdio>
@@ -15,6 +16,7 @@ Application::Application(int& argc, char** argv)
     setApplicationDisplayName(u"Lumora"_s);
     setQuitOnLastWindowClosed(false);
     Theme::apply(*this);
+    tellScreenReaders();
 }
 
 bool Application::notify(QObject* receiver, QEvent* event) {

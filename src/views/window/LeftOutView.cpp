@@ -2,6 +2,7 @@
 
 #include "views/kit/Overlay.h"
 #include "views/kit/Painting.h"
+#include "views/kit/ScreenReader.h"
 
 #include <QListWidget>
 #include <QPushButton>
@@ -25,6 +26,7 @@ LeftOutView::LeftOutView(Page& page, const SessionState& state, const Theme& the
     , m_goOn(button(leftOut.Command4Bli, Role::Main, std::move(goOn)))
     , m_back(button(leftOut.Command4Hazor, Role::Secondary, std::move(back)))
     , m_box(new Overlay(theme, this)) {
+    setAlert(*m_box);
     bindList(u"List4Siba"_s, leftOut.List4Siba);
     m_names->setProperty("dense", true);
     m_names->setIconSize({theme.px(cellSide), theme.px(cellSide)});

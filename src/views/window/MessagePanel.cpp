@@ -1,5 +1,7 @@
 #include "views/window/MessagePanel.h"
 
+#include "views/kit/ScreenReader.h"
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -9,6 +11,8 @@ MessagePanel::MessagePanel(const Theme& theme, QWidget* parent, Kind kind, const
     : Overlay(theme, parent) {
     setObjectName(u"messagePanel"_s);
     setAccessibleName(title.isEmpty() ? text.simplified() : title);
+    if (kind == Kind::Message)
+        setAlert(*this);
     QLabel* body = words(title.isEmpty() ? "strong" : "body", isolated(text.trimmed()));
     body->setObjectName(u"messageText"_s);
     body->setAlignment(Qt::AlignLeading | Qt::AlignVCenter);

@@ -6,6 +6,7 @@
 #include "views/kit/ChoiceCards.h"
 #include "views/kit/EditableCombo.h"
 #include "views/kit/Keyboard.h"
+#include "views/kit/ScreenReader.h"
 
 #include <QAbstractButton>
 #include <QApplication>
@@ -317,6 +318,7 @@ void PageView::follow(QWidget* widget, const Caption& caption) {
 
 void PageView::bindChoice(QAbstractButton* button, const CheckCaption& caption, std::function<void()> clicked) {
     button->setCheckable(true);
+    excludeOthers(*button);
     connect(button, &QAbstractButton::clicked, this, [this, clicked = std::move(clicked)] {
         clicked();
         schedule();

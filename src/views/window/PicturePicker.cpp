@@ -13,6 +13,7 @@
 #include "views/kit/CardOffer.h"
 #include "views/kit/ElidedLabel.h"
 #include "views/kit/Painting.h"
+#include "views/kit/ScreenReader.h"
 
 #include <QDateTime>
 #include <QFileInfo>
@@ -222,6 +223,7 @@ void PicturePicker::addPlaceButton(std::size_t i) {
     setButtonIcon(button, m_theme, place.icon, Theme::Colour::Primary);
     button->setProperty("folder", toText(place.folder));
     button->setCheckable(true);
+    excludeOthers(*button);
     button->setFixedWidth(m_theme.size(Extent::WideField));
     m_placeButtons.push_back(button);
     m_side->insertWidget(m_side->count() - 1, button); // above the stretch
