@@ -109,6 +109,10 @@ private:
     }
 
     void checkSheet(const QString& name) {
+        if (!has(name)) {
+            fault(u"%1: the order sheet is missing"_s.arg(name));
+            return;
+        }
         const Result<QByteArray> sheet = readHostFile(m_folder / toHostPath(name));
         const Result<void> whole = sheet ? checkWholeJpeg(*sheet) : Result<void>(sheet.failure());
         if (!whole)
@@ -226,8 +230,12 @@ Result<OrderFindings> checkOrderFolder(const fs::path& folder, PrintFileShape sh
         return Failure{Failure::Kind::NotFound, u"%1: no such folder"_s.arg(toText(folder))};
     const QString name = toText(fs::weakly_canonical(folder, error).filename());
     QStringList logs = namesWith(folder, ".txt");
-    if (logs.contains(name + u".txt"_s))
-        logs = {name + u".txt"_s};
+    // The log of an order in pieces may lack the "P" of its folder; a web server's lists are texts too.
+    const QString whole = TravelsInPieces(name) ? name.chopped(1) : name;
+    for (const QString& log : {name + u".txt"_s, whole + u".txt"_s}) {
+        if (logs.contains(log))
+            logs = {log};
+    }
     if (logs.size() != 1)
         return Failure{Failure::Kind::NotFound,
                        logs.isEmpty() ? u"%1: holds no order log"_s.arg(toText(folder))

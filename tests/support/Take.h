@@ -15,4 +15,9 @@ T take(Result<T> result) {
     return std::move(*result);
 }
 
+inline void take(const Result<void>& result) {
+    if (!result)
+        throw std::runtime_error(result.failure().message.toStdString());
+}
+
 } // namespace lumora

@@ -1,5 +1,6 @@
-// Tool for the lab's developers: shows, unpacks and checks print files and order folders.
+// Tool for the lab: shows, unpacks and checks print files and order folders, and takes orders in.
 
+#include "DeskCalls.h"
 #include "order/OrderCheck.h"
 #include "order/OrderTail.h"
 #include "order/PrintFileName.h"
@@ -123,18 +124,26 @@ int main(int argc, char** argv) {
     QCoreApplication::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
 
     QCommandLineParser parser;
-    parser.setApplicationDescription(u"Reads print files.\n\n"
-                                     u"  lumora-jpp info FILE...            what print files hold\n"
-                                     u"  lumora-jpp unpack FILE OUT.jpg     the picture of a print file\n"
-                                     u"  lumora-jpp check ORDER_FOLDER...   whether an order is whole\n\n"
-                                     u"Exit status: 0 all is well, 1 a file or an order is at fault, 2 the call is."_s);
+    parser.setApplicationDescription(
+        u"Reads print files, and is the lab's desk.\n\n"
+        u"  lumora-jpp info FILE...            what print files hold\n"
+        u"  lumora-jpp unpack FILE OUT.jpg     the picture of a print file\n"
+        u"  lumora-jpp check ORDER_FOLDER...   whether an order is whole\n"
+        u"  lumora-jpp watch FOLDER --into HOTFOLDER\n"
+        u"                                     takes in the orders that arrive in a folder\n"
+        u"  lumora-jpp export ORDER_FOLDER... --into FOLDER\n"
+        u"                                     the same with single orders, by hand\n"
+        u"  lumora-jpp report FOLDER --from DAY --to DAY\n"
+        u"                                     what watch has done: CSV and a page\n\n"
+        u"Exit status: 0 all is well, 1 a file or an order is at fault, 2 the call is."_s);
     parser.addHelpOption();
     parser.addVersionOption();
     const QCommandLineOption base(u"base"_s, u"What the profile adds to the length of a piece (30)."_s, u"NUMBER"_s,
                                   u"30"_s);
     const QCommandLineOption chunks(u"chunks"_s, u"Pieces of a print file, 1 to 32767 (56)."_s, u"NUMBER"_s, u"56"_s);
     parser.addOptions({base, chunks});
-    parser.addPositionalArgument(u"command"_s, u"info, unpack or check"_s);
+    DeskCalls::addOptions(parser);
+    parser.addPositionalArgument(u"command"_s, u"info, unpack, check, watch, export or report"_s);
     parser.addPositionalArgument(u"arguments"_s, u"as above"_s, u"ARGUMENT..."_s);
     if (!parser.parse(QCoreApplication::arguments())) {
         err() << parser.errorText() << Qt::endl;
@@ -160,6 +169,13 @@ int main(int argc, char** argv) {
         return unpack(arguments[0], arguments[1], shape);
     if (command == QLatin1String("check") && !arguments.isEmpty())
         return check(arguments, shape);
+    const DeskCalls desk(parser, shape);
+    if (command == QLatin1String("watch") && arguments.size() == 1)
+        return desk.watch(arguments[0]);
+    if (command == QLatin1String("export") && !arguments.isEmpty())
+        return desk.exportOrders(arguments);
+    if (command == QLatin1String("report") && arguments.size() == 1)
+        return desk.report(arguments[0]);
     err() << parser.helpText() << Qt::flush;
     return notUnderstood;
 }
