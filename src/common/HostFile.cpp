@@ -85,6 +85,12 @@ Result<Descriptor> openSource(const std::filesystem::path& host, const QString& 
     return source;
 }
 
+void readAhead(const std::filesystem::path& host) {
+    const Descriptor source(::open(host.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    if (source.valid())
+        static_cast<void>(::posix_fadvise(source.number(), 0, 0, POSIX_FADV_WILLNEED));
+}
+
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path) {
     for (;;) {
         const ssize_t count = ::read(source.number(), bytes, capacity);

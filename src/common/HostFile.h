@@ -41,6 +41,9 @@ private:
 // Opens a plain file for reading only. Anything else is a failure, since opening a pipe would wait for ever.
 Result<Descriptor> openSource(const std::filesystem::path& host, const QString& path);
 
+// Has the machine read a file that is wanted soon; does not wait for it.
+void readAhead(const std::filesystem::path& host);
+
 // The next bytes of an open file, up to the capacity given; 0 at the end.
 Result<std::size_t> readSome(const Descriptor& source, char* bytes, std::size_t capacity, const QString& path);
 

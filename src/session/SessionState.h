@@ -202,6 +202,7 @@ struct TransferState {
     Sending SugMishloah = Sending::NewOrder;
     Travel Mefurak = Travel::Whole;
     bool keptFtpSession = false;     // one FTP session a pass; else one a file
+    int ftpLines = 1;                // with a kept session: connections that files go by at once
     std::int16_t KeSherLaSharat = 0; // three values that the order log carries and nothing sets
     QString HitKasherDerech;
     std::int16_t TaooyotBaHaShvaa = 0;

@@ -88,6 +88,7 @@ TEST(LabFileTest, TellsWhatIsWrongWithLineKeyAndWhatIsAllowed) {
         {"[Server]\nFolder1 = ..\n", {"Server.Folder1"}},
         {"[Server]\nHost =\n", {"Server.Host", "host name"}},
         {"[Server]\nHost = a:70000\n", {"Server.Host", "65535"}},
+        {"[Server]\nLines = 5\n", {"Server.Lines", "1 to 4"}},
         {"[Server]\nJppChunks = 0\n", {"Server.JppChunks", "1 to 32767"}},
         {"[Client]\nLetter = Q\n", {"Client.Letter", "\"Q\"", "AS, B, C"}},
         {"[Client]\nCode = a/b\n", {"Client.Code"}},
@@ -148,6 +149,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     // The keys whose example is not the built-in value.
     Deployment expected;
     expected.Careful = expected.Waiting = expected.keptFtpSession = expected.watchedCards = true;
+    expected.ftpLines = 3;
     expected.door = {true, true, true};
     expected.OperatorArea = false;
     expected.profile.PriceListUrl = u"http://www.lumora.example/album_pricelist"_s; // else it follows the site
@@ -157,7 +159,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     SessionState session;
     LoadDefaultProfile(session, example.deployment);
     EXPECT_TRUE(session.Careful && !session.OperatorArea && !session.DegelEdit && session.transfer.keptFtpSession &&
-                session.albumTail == AlbumTail::Photographer);
+                session.transfer.ftpLines == 3 && session.albumTail == AlbumTail::Photographer);
 }
 
 TEST(LabFileTest, WarnsOfAPasswordThatOthersCanRead) {

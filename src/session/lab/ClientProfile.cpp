@@ -57,6 +57,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;
     state.transfer.keptFtpSession = deployment.keptFtpSession;
+    state.transfer.ftpLines = deployment.ftpLines;
     state.coupon.HaKoopon = deployment.HaKoopon;
     // A limit of 0 would refuse every order of a lab that takes coupons.
     state.coupon.SmallCount = deployment.HaKoopon == 1 ? 220 : 0;

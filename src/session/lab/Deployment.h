@@ -18,6 +18,7 @@ struct Deployment {
 
     FtpType ftpType = FtpType::Ascii; // only the FTP line uses it; dwType is 1 with both
     bool keptFtpSession = false;      // one session a pass; else one a file
+    int ftpLines = 1;                 // with a kept session: connections that files go by at once
     Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;

@@ -187,6 +187,7 @@ std::vector<Row> rows() {
          words<FtpType>(at(&D::ftpType), u"A or I"_s, {{u"A"_s, FtpType::Ascii}, {u"I"_s, FtpType::Image}})},
         {"Server", "Session",
          words<bool>(at(&D::keptFtpSession), u"each or kept"_s, {{u"each"_s, false}, {u"kept"_s, true}})},
+        {"Server", "Lines", number(at(&D::ftpLines), 1, 4)},
         {"Server", "JppChunks", number(at(&P::JppChunks), 1, 32767)},
         {"Server", "JppBase", number(at(&P::JppBase), 0, 32767)},
         {"Server", "JppTail", words<I>(at(&D::SugTzad), u"40 or 60"_s, {{u"40"_s, 40}, {u"60"_s, 60}})},
