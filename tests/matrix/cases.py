@@ -23,9 +23,9 @@ LAB = (FOLDER / 'lab.ini.in').read_text()
 class Tools:
     """The programs under test and what all cases share."""
 
-    def __init__(self, drive, quick_time, pictures, scratch, unpacked, kept):
+    def __init__(self, drive, quick_time, pictures, scratch, unpacked, kept, lines):
         self.drive, self.quick_time, self.scratch, self.unpacked, self.kept = drive, quick_time, scratch, unpacked, kept
-        self.make_pictures = pictures
+        self.make_pictures, self.lines = pictures, lines
         self.pictures, self.other_pictures = self.shown('shown', PICTURES, '0.2'), self.shown('shown-other', PICTURES, '0.1')
         self.crypt = subprocess.check_output(['openssl', 'passwd', '-6', PASSWORD], text=True).strip()
         self.playing = set()
@@ -139,8 +139,7 @@ class Case:
         for name in ('uploads', 'account/' + ACCOUNT):
             (self.folder / name).mkdir(parents=True, mode=0o700)
         self.mine.make(self.pictures)
-        acts = self.acts = {word: Act(*(part[self.kept] if isinstance(part, tuple) else part for part in spec))
-                            for word, spec in self.fault.acts.items()}
+        acts = self.acts = {word: Act(*(self.of_session(part) for part in spec)) for word, spec in self.fault.acts.items()}
         self.web = WebLab(self.folder / 'uploads', acts if self.way == 'http' else {}, self)
         if self.way == 'ftp':
             account = self.folder / 'account'
@@ -148,6 +147,14 @@ class Case:
                 RealFtp(self.server, account, self.folder / 'server', self.tools.unpacked, self.tools.crypt,
                         not self.fault.as_installed)
             self.relay = Relay(self.ftp.port, acts, self, '::1' if self.fault.host == 'ipv6' else '127.0.0.1')
+
+    def of_session(self, part):
+        """Of a pair the number that is meant, which a function may tell for a kept session."""
+        number = part[self.kept] if isinstance(part, tuple) else part
+        return number(self) if isinstance(part, tuple) and callable(number) else number
+
+    def takes_type_i(self):
+        return self.server in ('pure-ftpd', 'proftpd') and not self.fault.as_installed
 
     def close(self):
         for end in (self.relay, self.ftp, self.web):
@@ -216,10 +223,10 @@ class Case:
                           account=ACCOUNT, web=f'127.0.0.1:{self.web.port}', sender=self.way, data=workspace.data)
         text = text.replace('[Switches]\n', '[Switches]\n' + self.switches)
         text += '[Guards]\nCareful = yes\n' if self.careful else ''
-        if self.server in ('pure-ftpd', 'proftpd') and not self.fault.as_installed:
+        if self.takes_type_i():
             text = text.replace('[Addresses]', 'Type = I\n[Addresses]')
         if self.kept:
-            text = text.replace('[Addresses]', 'Session = kept\n[Addresses]')
+            text = text.replace('[Addresses]', f'Session = kept\nLines = {self.tools.lines}\n[Addresses]')
         return text
 
     def play(self, *scenarios, healed=False, **environment):
@@ -267,8 +274,10 @@ class Case:
         return found + self.wrong_reports(reports)
 
     def never_came(self):
-        """True where a thing was never done, at none of its commands. As built in the server is asked for no length and no log."""
-        done = {act.do for word, act in self.acts.items() if act.come >= act.first or not self.careful and word in ('SIZE', 'HEAD', 'RETR')}
+        """True where a thing was never done, at none of its commands. As built in the server is asked for no length and no log, by a kept
+        session for no length that a listing tells."""
+        unasked = ('SIZE', 'HEAD', 'RETR') if not self.careful else ('SIZE',) if self.kept and self.way == 'ftp' else ()
+        done = {act.do for word, act in self.acts.items() if act.come >= act.first or word in unasked}
         return any(act.do not in done for act in self.acts.values())
 
     def wrong_reports(self, wanted):

@@ -23,6 +23,7 @@ public:
         , m_aborts(lab.aborts) {}
 
     Result<void> setCurrentDirectory(const QString& directory) override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut())
             return cut();
         const QString target = directory.startsWith(u'/') ? directory.mid(1) : below(directory);
@@ -33,12 +34,14 @@ public:
     }
 
     Result<QString> currentDirectory() override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut())
             return cut();
         return u'/' + m_here;
     }
 
     Result<void> makeDirectory(const QString& name) override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut())
             return cut();
         if (isBroken(name) || m_lab.refusesFolders || m_lab.folders.contains(below(name)))
@@ -48,6 +51,7 @@ public:
     }
 
     Result<void> put(const HostPath& local, const QString& remoteName) override {
+        std::unique_lock lock(m_lab.mutex);
         if (isCut())
             return cut();
         const Result<QByteArray> content = readWholeFile(local, remoteName, 1 << 30);
@@ -56,8 +60,11 @@ public:
         if (isBroken(remoteName))
             return no(u"553 Could not create file."_s);
         m_lab.puts += remoteName;
-        if (m_lab.onPut)
+        if (m_lab.onPut) {
+            lock.unlock();
             m_lab.onPut(remoteName);
+            lock.lock();
+        }
         if (isCut()) { // meanwhile
             m_lab.folders[m_here][remoteName] = content->left(content->size() / 2);
             return cut();
@@ -88,6 +95,7 @@ public:
     }
 
     Result<void> remove(const QString& remoteName) override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut())
             return cut();
         if (m_lab.refusesDelete || m_lab.folders[m_here].erase(remoteName) == 0)
@@ -96,6 +104,7 @@ public:
     }
 
     Result<FtpListing> list(const QString& pattern, EmptyFolder empty) override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut() || FakeLab::strikes(m_lab.failedListings)) {
             m_cut = true;
             return cut();
@@ -123,6 +132,7 @@ public:
     }
 
     Result<std::optional<qint64>> length(const QString& remoteName) override {
+        const std::lock_guard lock(m_lab.mutex);
         if (isCut())
             return cut();
         ++m_lab.sizesAsked;
@@ -177,6 +187,7 @@ bool FakeLab::open() {
 
 Result<std::unique_ptr<FtpConnection>> FakeLab::connectFtp(const QString&, const QString&, const QString&,
                                                            DataChannel channel) {
+    const std::lock_guard lock(mutex);
     ++connects;
     lastChannel = channel;
     if (onConnect)

@@ -6,6 +6,7 @@
 
 #include <functional>
 #include <map>
+#include <mutex>
 #include <utility>
 #include <vector>
 
@@ -72,9 +73,13 @@ public:
     Result<std::unique_ptr<FtpConnection>> connectFtp(const QString& host, const QString& user, const QString& password,
                                                       DataChannel channel) override;
     Result<WebAnswer> fetch(const QString& url) override;
-    void abort() override { ++aborts; }
+    void abort() override {
+        const std::lock_guard lock(mutex);
+        ++aborts;
+    }
     EventPump* pumpWhileWaiting(EventPump* given) override { return std::exchange(pump, given); }
-    EventPump* pump = nullptr; // while a call waits
+    EventPump* pump = nullptr;  // while a call waits
+    std::recursive_mutex mutex; // held by each call but while onPut runs
 
     DataChannel lastChannel = DataChannel::Passive;
 };

@@ -26,6 +26,7 @@ public:
     void progressed(int, int) override {}
     void sending(int, int, const QString& name) override { names += name; }
     void pieceSent(double, std::optional<int>) override {}
+    void movedBytes(qint64, qint64, std::optional<int>) override {}
     void failed(LineStep step, const Failure& failure, const QString& subject) override {
         troubles.push_back({step, failure, subject});
     }

@@ -133,8 +133,11 @@ const QList<QByteArray> others = {"550 no", "450 later", {}};
 
 TEST(FtpCommands, AWholeOrderAsksForThisAndNoMore) {
     const QString name = FtpFrmRig::name(), passive = u"EPSV|LIST|"_s, enter = u"CWD "_s + name + u'|';
-    for (const auto& [careful, kept, type] :
-         {std::tuple(true, false, 'A'), {true, true, 'A'}, {true, true, 'I'}, {false, false, 'A'}}) {
+    for (const auto& [careful, kept, type] : {std::tuple(true, false, 'A'),
+                                              {true, true, 'A'},
+                                              {true, true, 'I'},
+                                              {false, false, 'A'},
+                                              {false, true, 'A'}}) {
         SCOPED_TRACE(std::string(careful ? "careful " : "") + (kept ? "kept " : "") + type);
         Line line(careful, kept, type == 'A' ? FtpType::Ascii : FtpType::Image);
         EXPECT_EQ(line.send(), SendingPhase::Success);
@@ -145,17 +148,20 @@ TEST(FtpCommands, AWholeOrderAsksForThisAndNoMore) {
         QString expected;
         for (const QString& file : FtpFrmRig::names()) {
             const bool first = file == FtpFrmRig::log();
-            if (first || !kept)
-                expected += walk + (first ? u"MKD "_s + name + u'|' + passive : QString()) + enter +
-                            (careful || !first ? passive : QString());
+            const QString make = u"MKD "_s + name + u'|';
+            if (kept && first)
+                expected += u"CONNECT|USER lumora|PASS morvex482|PWD|CWD zalamim234|PWD|"_s + enter + make + enter +
+                            typed + (careful ? passive : QString());
+            else if (!kept)
+                expected +=
+                    walk + (first ? make + passive : QString()) + enter + (careful || !first ? passive : QString());
             expected += u"EPSV|STOR "_s + file + u'|';
             if (first && careful)
-                expected += image + u"SIZE "_s + file + u'|' + (kept && !image.isEmpty() ? typed : QString());
-            if (!kept || file == FtpFrmRig::proof())
-                expected += u"QUIT|"_s;
+                expected += kept && type == 'A' ? passive : image + u"SIZE "_s + file + u'|';
+            expected += kept ? QString() : u"QUIT|"_s;
         }
-        EXPECT_EQ(line.lab.asked.join(u'|').toStdString(),
-                  (expected + walk + enter + passive + u"QUIT"_s).toStdString());
+        expected += (kept ? passive : walk + enter + passive) + u"QUIT"_s;
+        EXPECT_EQ(line.lab.asked.join(u'|').toStdString(), expected.toStdString());
     }
 }
 
@@ -174,7 +180,7 @@ TEST(FtpCommands, AReplyThatIsReplacedOnceCostsNoFileAndNoOther) {
                 << nth << ' ' << at.toStdString() << ' ' << other.toStdString();
             EXPECT_EQ(line.lab.asked.filter(u"STOR"_s).size(), at.startsWith("STOR") ? 6 : 5)
                 << nth << other.toStdString();
-            EXPECT_TRUE(!at.isEmpty() || nth > 40);
+            EXPECT_TRUE(!at.isEmpty() || nth > 30);
         }
     }
 }
@@ -182,7 +188,8 @@ TEST(FtpCommands, AReplyThatIsReplacedOnceCostsNoFileAndNoOther) {
 TEST(FtpCommands, AnOrderEndsWhereACommandIsNeverAnsweredWell) {
     using enum SendingPhase;
     for (const auto& [commands, refused, cut] :
-         {std::tuple(u"CONNECT|USER|PASS|PWD|TYPE|EPSV|LIST|LIST end|CWD|STOR|STOR end"_s, NotAll, NotAll),
+         {std::tuple(u"CONNECT|USER|PASS|PWD|TYPE|EPSV|CWD|STOR|STOR end"_s, NotAll, NotAll),
+          {u"LIST|LIST end"_s, Unclear, NotAll},
           {u"MKD"_s, NotAll, Success},
           {u"SIZE"_s, Success, Success}}) {
         for (const QString& command : commands.split(u'|')) {
@@ -193,7 +200,8 @@ TEST(FtpCommands, AnOrderEndsWhereACommandIsNeverAnsweredWell) {
                 };
                 const SendingPhase end = other.isEmpty() ? cut : refused;
                 EXPECT_EQ(line.send(), end) << command.toStdString() << ' ' << other.toStdString();
-                EXPECT_EQ(line.isWhole(), end == Success) << command.toStdString() << ' ' << other.toStdString();
+                EXPECT_EQ(line.isWhole(), end == Success || end == Unclear)
+                    << command.toStdString() << ' ' << other.toStdString();
             }
         }
     }

@@ -301,6 +301,24 @@ TEST_F(FtpFrmTest, SendsTheFirstSheetAndThePiecesOfAnOrderInPieces) {
         << "by its name it is no order in pieces, and its pictures were not sent";
 }
 
+TEST_F(FtpFrmTest, AKeptSessionTellsItsWayInBytesAndAllOfThemOnlyOnceTheyHaveArrived) {
+    rig.state.transfer.keptFtpSession = true;
+    rig.write(FtpFrmRig::first(), QByteArray(3'000'000, 'x'));
+    rig.write(FtpFrmRig::second(), QByteArray(1'000'000, 'x'));
+    QMap<QString, int> shares;
+    QString atTheEnd;
+    lab.onPut = [&](const QString& name) {
+        shares[name] = rig.page().controls().percent;
+        atTheEnd = rig.page().controls().Label4Bytes.visible ? rig.page().controls().Label4Bytes.text : QString();
+    };
+    rig.send();
+    EXPECT_EQ(shares[FtpFrmRig::log()], 0);
+    EXPECT_EQ(shares[FtpFrmRig::second()], 74);
+    EXPECT_EQ(shares[FtpFrmRig::proof()], 99);
+    EXPECT_TRUE(atTheEnd.startsWith(u"4.0 "_s)) << atTheEnd.toStdString();
+    EXPECT_TRUE(rig.page().controls().percent == 100 && !rig.page().controls().Label4Bytes.visible);
+}
+
 TEST_F(FtpFrmTest, SendsAChainOfOrdersAndDropsWhatIsThere) {
     rig.state.transfer.SugMishloah = Sending::Chain;
     FtpFrm& page = rig.start();

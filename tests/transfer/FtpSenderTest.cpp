@@ -1,10 +1,15 @@
 #include "transfer/ftp/FtpSender.h"
+#include "order/OrderFolder.h"
+#include "order/OrderState.h"
 #include "support/FakeLab.h"
 #include "support/RecordedSending.h"
 #include "support/TestPlatform.h"
 #include "transfer/delivery/StoppableLine.h"
 
 #include <gtest/gtest.h>
+
+#include <condition_variable>
+#include <mutex>
 
 namespace lumora {
 
@@ -230,6 +235,105 @@ TEST(FtpSender, AKeptSessionServesAPassUntilAFaultBeginsAnother) {
         };
     };
     EXPECT_EQ(sessions(endsBehindEachPut), std::pair(5, 2)) << "each file has its own once the second one has failed";
+}
+
+// An order that goes by three lines, and what is under way when they all put.
+struct ByLines : Line {
+    ByLines() {
+        transfer.keptFtpSession = true;
+        transfer.ftpLines = 3;
+        for (const QString& name : names)
+            EXPECT_TRUE(test.files.writeWhole(path(name), name.toLatin1().repeated(50)));
+        order(names);
+        lab.onPut = [this](const QString& name) { put(name); };
+    }
+    // Waits until three files are under way, or nothing more comes.
+    void put(const QString& name) {
+        std::unique_lock lock(mutex);
+        under += name;
+        most = std::max(most, under.size());
+        alone[name] = under.size() == 1;
+        told.notify_all();
+        if (name == names.first() || name == names.last())
+            EXPECT_TRUE(alone[name]) << name.toStdString();
+        else
+            told.wait_for(lock, std::chrono::milliseconds(200), [&] { return most >= 3; });
+        if (most == 3 && !std::exchange(met, true) && whenAllPut)
+            whenAllPut();
+        under.removeAll(name);
+    }
+    OrderState kept() const {
+        const Result<OrderState> state = ReadOrderState(test.files, OrderFolder(folder));
+        return state ? *state : OrderState();
+    }
+
+    const QStringList names{u"log.txt"_s, u"1"_s, u"2"_s, u"3"_s, u"4"_s, u"5"_s, u"6"_s, u"000.jpg"_s};
+    std::function<void()> whenAllPut;
+    std::mutex mutex;
+    std::condition_variable told;
+    QStringList under;
+    QMap<QString, bool> alone;
+    qsizetype most = 0;
+    bool met = false;
+};
+
+TEST(FtpSender, BetweenTheLogAndTheSmallPictureFilesGoByThreeLinesAndAllAreInHand) {
+    ByLines line;
+    QStringList inHand;
+    line.whenAllPut = [&] { inHand = line.kept().filesInHand; };
+    EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
+    EXPECT_TRUE(line.most == 3 && line.lab.connects == 3 && line.lab.puts.size() == line.names.size());
+    EXPECT_EQ(inHand.size(), 3) << "a program that is killed now looks at each of them again";
+    EXPECT_TRUE(line.kept().filesInHand.isEmpty());
+}
+
+TEST(FtpSender, AFaultOfALineCostsItsFileAndOneThatIsNotLetInCostsNothing) {
+    const struct {
+        const char* what;
+        std::function<void(ByLines&)> arrange;
+        qsizetype most;
+        int attempts;
+    } cases[] = {
+        {"421", [](ByLines& line) { line.lab.onConnect = [&](int number) { line.lab.deadConnects = number > 1; }; }, 1,
+         1},
+        {"530", [](ByLines& line) { line.lab.onConnect = [&](int number) { line.lab.refusedLogins = number > 1; }; }, 1,
+         1},
+        {"a put is cut",
+         [](ByLines& line) {
+             line.lab.putFaults = {{u"4"_s, 1, 20}};
+         },
+         3, 2},
+        {"each put is cut once",
+         [](ByLines& line) {
+             for (const QString& name : line.names)
+                 line.lab.putFaults.push_back({name, 1, 20});
+         },
+         1, 2},
+    };
+    for (const auto& each : cases) {
+        SCOPED_TRACE(each.what);
+        ByLines line;
+        each.arrange(line);
+        EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
+        EXPECT_EQ(line.remote().size(), static_cast<std::size_t>(line.names.size()));
+        EXPECT_EQ(line.most, each.most);
+        EXPECT_EQ(line.sender.lists.List7.count() == 0, each.attempts == 1);
+        EXPECT_EQ(line.told.troubles.empty(), each.attempts == 1);
+        EXPECT_EQ(line.told.number(AttemptBegins), each.attempts);
+        EXPECT_TRUE(line.kept().filesInHand.isEmpty());
+    }
+}
+
+TEST(FtpSender, AStopCutsEachLineAndWhatWasInHandIsSentAgain) {
+    ByLines line;
+    line.whenAllPut = [&] { line.sender.stopNow(); };
+    EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Stopped);
+    EXPECT_EQ(line.told.troubles.size(), 0u);
+    EXPECT_EQ(line.sender.lists.List4Broken.count(), 3);
+    EXPECT_EQ(line.lab.puts.size(), 4);
+    line.sender.refill();
+    EXPECT_EQ(line.sender.RunAttempts(), SendingPhase::Success);
+    EXPECT_EQ(line.lab.puts.size(), 3 + line.names.size());
 }
 
 TEST_F(FtpSenderTest, AnEmptyFolderOnTheServerCountsAsOneFile) {

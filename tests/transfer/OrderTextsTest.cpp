@@ -1,6 +1,7 @@
 #include "support/ExampleOrder.h"
 #include "transfer/delivery/OrderFacts.h"
 #include "transfer/delivery/OrderSummary.h"
+#include "transfer/delivery/UploadPace.h"
 #include "transfer/delivery/UploadProgress.h"
 
 #include <gtest/gtest.h>
@@ -89,6 +90,25 @@ TEST(UploadProgress, CountsFromNoneToAllAndCutsDown) {
     EXPECT_EQ(UploadPercent(16, 17), 100);
     EXPECT_EQ(BarWidth(33, 1000), 330);
     EXPECT_EQ(BarWidth(33, 5), 1);
+}
+
+TEST(UploadProgress, MinutesFollowThePaceSlowlyAndStayUntilTheyAreWrong) {
+    UploadPace pace;
+    qint64 put = 0;
+    int now = 0;
+    const auto go = [&](int seconds, qint64 rate) {
+        for (int i = 0; i < seconds; ++i)
+            pace.moved(put += rate, std::chrono::seconds(++now));
+    };
+    go(3, 100'000);
+    EXPECT_FALSE(pace.minutes(12'000'000)) << "too early to know";
+    go(20, 100'000);
+    EXPECT_EQ(pace.minutes(12'000'000), 2);
+    EXPECT_EQ(pace.minutes(6'500'000), 2);
+    EXPECT_EQ(pace.minutes(5'300'000), 1);
+    EXPECT_EQ(pace.minutes(24'000'000), 4);
+    go(3, 0);
+    EXPECT_EQ(pace.minutes(24'000'000), 5) << "the line has paused for a moment";
 }
 
 TEST(UploadProgress, ReadsThePlaceOfAPieceFromItsName) {

@@ -34,6 +34,7 @@ public:
     Result<std::optional<qint64>> length(const QString& remoteName);
 
     QString lastResponse() const;
+    FtpType type() const { return m_type; }
 
 private:
     struct Reply {

@@ -43,6 +43,9 @@ class FtpConnection {
 public:
     virtual ~FtpConnection() = default;
 
+    // The transfer type of the line.
+    virtual FtpType type() const { return FtpType::Ascii; }
+
     // Relative to the current directory unless it begins at the root, which is the folder that the login leads to.
     virtual Result<void> setCurrentDirectory(const QString& directory) = 0;
     // From the login folder on, with a slash in front.

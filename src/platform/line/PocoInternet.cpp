@@ -70,6 +70,7 @@ public:
         return run([&](FtpSessionWire& wire) { return wire.length(remoteName); });
     }
     QString lastResponse() const override { return m_wire->lastResponse(); }
+    FtpType type() const override { return m_wire->type(); }
 
 private:
     std::shared_ptr<PocoInternet::Line> m_line;

@@ -67,6 +67,9 @@ public:
     virtual void sending(int index, int count, const QString& name) = 0;
     // share: part of the order's pieces that is sent, 0 to 1. minutes: minutes left, if the pace is known.
     virtual void pieceSent(double share, std::optional<int> minutes) = 0;
+    // So many bytes of the order's files are there, of so many, as far as the line can tell. minutes: minutes left, if
+    // the pace is known.
+    virtual void movedBytes(qint64 there, qint64 all, std::optional<int> minutes) = 0;
     // subject: the file's name, if the step is about a file.
     virtual void failed(LineStep step, const Failure& failure, const QString& subject = {}) = 0;
     // A step of the sending could not be written into the order's folder.

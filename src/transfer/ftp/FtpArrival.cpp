@@ -127,20 +127,30 @@ bool FtpArrival::oneWayExplains(const QStringList& changed, const QList<RemoteFi
     return !changed.isEmpty() && !ways.empty();
 }
 
+// Under type A many a server refuses SIZE, and the type is to be changed for it and back again.
+std::optional<qint64> FtpArrival::lengthAfterPut(FtpConnection& connection, const QString& name) {
+    const auto listed = [&] {
+        const Result<FtpListing> listing = connection.list(u"*.*"_s);
+        std::optional<qint64> length;
+        for (const FtpEntry& entry : listing ? listing->entries : std::vector<FtpEntry>()) {
+            if (entry.name == name)
+                length = entry.length;
+        }
+        return length;
+    };
+    const bool listsFirst = m_state.transfer.keptFtpSession && connection.type() == FtpType::Ascii;
+    if (const std::optional<qint64> length = listsFirst ? listed() : ask(connection, name))
+        return length;
+    return listsFirst ? ask(connection, name) : listed();
+}
+
 bool FtpArrival::lineEndsChanged(FtpConnection& connection, const QString& path, const QStringList& paths,
                                  const QList<RemoteFile>& there) {
     const QString name = LeafName(path);
     if (!decides() || m_firstLooked || isShared(name))
         return false;
     m_firstLooked = true;
-    std::optional<qint64> length = ask(connection, name);
-    if (!length) {
-        const Result<FtpListing> listing = connection.list(u"*.*"_s);
-        for (const FtpEntry& entry : listing ? listing->entries : std::vector<FtpEntry>()) {
-            if (entry.name == name)
-                length = entry.length;
-        }
-    }
+    const std::optional<qint64> length = lengthAfterPut(connection, name);
     QStringList whole;
     for (const QString& each : paths) {
         const RemoteFile* entry = entryOf(there, LeafName(each));

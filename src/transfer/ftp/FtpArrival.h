@@ -47,6 +47,7 @@ private:
     };
     std::optional<Found> lengthsOf(FtpConnection& connection, const QString& path, const QList<RemoteFile>& there);
     std::optional<qint64> ask(FtpConnection& connection, const QString& name);
+    std::optional<qint64> lengthAfterPut(FtpConnection& connection, const QString& name);
     bool oneWayExplains(const QStringList& changed, const QList<RemoteFile>& there, const QStringList& whole) const;
 
     const SessionState& m_state;

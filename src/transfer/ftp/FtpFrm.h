@@ -127,6 +127,7 @@ private:
     std::span<const PhaseLook> looks() const override;
     QString advice(const PhaseLook& row) const override;
     void showPhase(const PhaseLook& row) override;
+    void showPercent(int share);
     void showMinutes();
     void showFileCount(int files);
     void showCounts();
@@ -145,6 +146,7 @@ private:
     void progressed(int index, int count) override;
     void sending(int index, int count, const QString& name) override;
     void pieceSent(double share, std::optional<int> minutes) override;
+    void movedBytes(qint64 there, qint64 all, std::optional<int> minutes) override;
     void failed(LineStep step, const Failure& failure, const QString& subject) override;
     void notKept(const Failure& failure) override;
     void enteredFolder(int level, const QString& asTold, const QString& withoutSlash) override;
@@ -208,7 +210,7 @@ private:
     QStringList m_handedOver; // paths from the page of finished orders
     int m_fileCount = 0;      // of the order, as the sending counts them
     std::optional<int> m_printCount;
-    std::optional<int> m_minutesLeft; // known from the second piece on
+    std::optional<int> m_minutesLeft; // known from the second piece on, of a kept session once the pace is
     bool m_incomplete = false;        // the pass has left files behind
     bool m_byHand = false;            // a step of the manual panel is under way
     // Command26 shows the proof picture if a page has set both; none does.

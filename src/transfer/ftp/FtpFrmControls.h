@@ -42,7 +42,8 @@ struct FtpFrmControls : SendingControls {
     static constexpr int Pic4ProgWidth = 1000;
     Caption LabelProg{*this, u"LabelProg"}; // "42  %"
     Caption Pic4Prog{*this, u"Pic4Prog", Caption::At::Hidden};
-    int PicInProgWidth = 0; // 0 to Pic4ProgWidth
+    int PicInProgWidth = 0;                                          // 0 to Pic4ProgWidth
+    Caption Label4Bytes{*this, u"Label4Bytes", Caption::At::Hidden}; // "4.2 of 31.0 MB", of a kept session
     Caption PicInProgKatan{*this, u"PicInProgKatan", Caption::At::Hidden};
     int PicInProgKatanWidth = 0;                                             // pieces sent, 0 to Pic4ProgWidth
     Caption Label4Diff{*this, u"Label4Diff", Caption::At::Hidden};           // estimated minutes left

@@ -30,6 +30,9 @@ struct StatusLine {
 using enum StatusLine::Number;
 using enum StatusLine::Told;
 
+constexpr int mostBeforeTheEnd = 99; // per cent
+constexpr double bytesOfMegabyte = 1e6;
+
 constexpr std::array statusLines{
     StatusLine{SendingMoment::Opening, {u"  קשר ראשוני ", u"  First contact "}, Last, WholeFiles},
     StatusLine{SendingMoment::Connecting,
@@ -97,6 +100,9 @@ void FtpFrm::reached(SendingMoment moment, int number) {
         break;
     case SendingMoment::PassBegins:
         m_incomplete = false;
+        Label4Bytes.text.clear();
+        if (m_sender.session.isKept())
+            m_minutesLeft.reset();
         Picture6.visible = Frame9.visible = Image6.visible = false;
         break;
     case SendingMoment::PassEnds:
@@ -183,14 +189,33 @@ void FtpFrm::showIncomplete(int missing) {
 void FtpFrm::progressed(int index, int count) {
     if (inPieces())
         Pic4Prog.visible = true;
-    percent = UploadPercent(index, count);
+    // A kept session tells its bytes.
+    showPercent(m_sender.session.isKept() ? percent : UploadPercent(index, count));
+    Label4File.text = wording(u"קובץ %1 מתוך %2", u"File %1 of %2").arg(index + 1).arg(count);
+    Q_EMIT changed();
+}
+
+void FtpFrm::showPercent(int share) {
+    percent = share;
     PicInProgWidth = BarWidth(percent, Pic4ProgWidth);
     const QString number = QString::number(percent);
     caption = number + u" %"_s +
               wording(u"  נא לא לסגור את החלון עד לגמר כל המשלוח  ",
                       u"  Please do not close the window until the end of the whole sending  ");
     LabelProg.text = number + u"  %"_s;
-    Label4File.text = wording(u"קובץ %1 מתוך %2", u"File %1 of %2").arg(index + 1).arg(count);
+}
+
+// All is there once the check has found it.
+void FtpFrm::movedBytes(qint64 there, qint64 all, std::optional<int> minutes) {
+    const auto share = static_cast<int>(there * 100 / std::max<qint64>(all, 1));
+    showPercent(std::min(share, mostBeforeTheEnd));
+    const auto megabytes = [](qint64 bytes) {
+        return QString::number(static_cast<double>(bytes) / bytesOfMegabyte, 'f', 1);
+    };
+    Label4Bytes.text =
+        wording(u"%1 מתוך %2 מגה־בייט", u"%1 of %2 MB").arg(megabytes(std::min(there, all)), megabytes(all));
+    m_minutesLeft = minutes;
+    showMinutes();
     Q_EMIT changed();
 }
 

@@ -136,8 +136,13 @@ void FtpFrm::showPhase(const PhaseLook& row) {
 void FtpFrm::showMinutes() {
     if (m_minutesLeft)
         Label4Diff.text = QString::number(*m_minutesLeft);
+    const bool kept = m_sender.session.isKept();
+    if (kept)
+        Label4Minutes.text = m_minutesLeft == 1 ? wording(u"דקה", u"minute") : wording(u"דקות", u"minutes");
     Label4Diff.visible = Label4DiffTitle.visible = Label4Minutes.visible =
-        isUnderWay(phase()) && inPieces() && m_minutesLeft;
+        m_minutesLeft &&
+        (kept ? phase() == SendingPhase::Sending && *m_minutesLeft > 0 : isUnderWay(phase()) && inPieces());
+    Label4Bytes.visible = phase() == SendingPhase::Sending && !Label4Bytes.text.isEmpty();
 }
 
 void FtpFrm::setTexts() {

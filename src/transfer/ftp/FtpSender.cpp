@@ -14,8 +14,8 @@ public:
         , m_sender(sender) {}
 
 private:
-    std::optional<SendingPhase> sendMissing(int) override {
-        m_sender.pass.run();
+    std::optional<SendingPhase> sendMissing(int attempt) override {
+        m_sender.pass.run(attempt);
         return m_sender.pass.UserStopped == 0 ? m_sender.pass.end() : SendingPhase::Stopped;
     }
 

@@ -119,31 +119,8 @@ void FtpSession::FtpConnectServer() {
     m_lists.List1.clear();
     connectTimedOut = false;
     if (!bActiveSession && hOpen) {
-        const auto channel = passive ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
-        int count = 0;
-        Failure last = noLine();
-        connectTimedOut = true;
-        while (count < connectAttempts && !hConnection && !m_stop.left && !m_stop.StopFlag) {
-            pump();
-            if (m_stop.StopFlag)
-                break;
-            tell(SendingMoment::Connecting, ++count);
-            auto connected = m_platform.internet.connectFtp(FtpHost, FtpUser, FtpPass, channel);
-            if (connected)
-                hConnection = std::move(*connected);
-            else
-                last = connected.failure();
-            connectTimedOut = connectTimedOut && !connected && last.kind == Failure::Kind::TimedOut;
-        }
-        if (!hConnection) {
-            bActiveSession = false;
-            if (m_stop.StopFlag)
-                return;
-            trouble(LineStep::Connect, last);
-            tell(SendingMoment::NotConnected, count);
+        if (!connect())
             return;
-        }
-        bActiveSession = true;
         m_lists.List1.append(FtpHost);
         ListRemote({});
         if (!colNames.isEmpty())
@@ -152,7 +129,74 @@ void FtpSession::FtpConnectServer() {
     tell(SendingMoment::Connected);
 }
 
+// False: nobody answers, which is told.
+bool FtpSession::connect() {
+    int count = 0;
+    Failure last = noLine();
+    connectTimedOut = true;
+    while (count < connectAttempts && !hConnection && !m_stop.left && !m_stop.StopFlag) {
+        pump();
+        if (m_stop.StopFlag)
+            break;
+        tell(SendingMoment::Connecting, ++count);
+        auto connected = m_platform.internet.connectFtp(FtpHost, FtpUser, FtpPass, dataChannel());
+        if (connected)
+            hConnection = std::move(*connected);
+        else
+            last = connected.failure();
+        connectTimedOut = connectTimedOut && !connected && last.kind == Failure::Kind::TimedOut;
+    }
+    bActiveSession = hConnection != nullptr;
+    if (!hConnection && !m_stop.StopFlag) {
+        trouble(LineStep::Connect, last);
+        tell(SendingMoment::NotConnected, count);
+    }
+    return bActiveSession;
+}
+
+QStringList FtpSession::foldersOfLab() const {
+    QStringList names{m_profile.FtpFolder1, m_profile.FtpFolder2};
+    names.removeAll(QString());
+    return names;
+}
+
+void FtpSession::enterByNames() {
+    FtpOpenInternet();
+    tell(SendingMoment::WalkStep);
+    connectTimedOut = FolderOk = false;
+    MikumBaSharat.clear();
+    if (!hOpen || (!bActiveSession && !connect()))
+        return;
+    tell(SendingMoment::Connected);
+    tell(SendingMoment::WalkStep);
+    for (const QString& name : foldersOfLab()) {
+        if (!FtpChangeDir(name)) {
+            ++ConnectFails;
+            tell(SendingMoment::FolderMissing);
+            return;
+        }
+    }
+    ConnectFails = 0;
+    RoundNo = 0;
+    FolderOk = true;
+    tell(SendingMoment::FolderFound);
+    tellFolder(2);
+    tell(SendingMoment::WalkStep);
+}
+
+void FtpSession::listOrderFolders() {
+    if (!isKept() || !FtpChangeDir(u'/' + foldersOfLab().join(u'/')))
+        return;
+    m_inOrderFolder = false;
+    ListRemoteHere();
+    FillListFromNames(Target::List5, {});
+}
+
 void FtpSession::walkToLabFolder() {
+    if (isKept()) {
+        enterByNames();
+        return;
+    }
     FtpOpenInternet();
     tell(SendingMoment::WalkStep);
     PauseBar();
@@ -178,6 +222,10 @@ void FtpSession::openFolder(const QString& name, int level) {
     FillListFromNames(level == 1 ? Target::List4 : Target::List5, name);
     if (level == 1)
         tell(SendingMoment::InsideServer);
+    tellFolder(level);
+}
+
+void FtpSession::tellFolder(int level) {
     const QString asTold = CurrentRemoteDir();
     MikumBaSharat = withoutFirstSlash(asTold);
     m_events.enteredFolder(level, asTold, MikumBaSharat);
@@ -220,6 +268,13 @@ bool FtpSession::enterListedFolder(const QString& name, bool made) {
         trouble(LineStep::OrderFolder, entered.failure());
         return false;
     }
+    return lookAround(name, made);
+}
+
+bool FtpSession::lookAround(const QString& name, bool made) {
+    m_inOrderFolder = false;
+    if (!hConnection)
+        return false;
     // Once a put was tried, a refused listing may hide what it left.
     listHere(m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused);
     if (!bActiveSession || !mayJoin(name, made))
@@ -270,9 +325,11 @@ bool FtpSession::mayJoin(const QString& name, bool made) {
 }
 
 bool FtpSession::joinOrderFolder(const QString& name, bool made) {
-    if (!enterListedFolder(name, made))
-        return false;
-    if (!isKept(m_journal->sendingBegins(Sender::Ftp, m_owner == FtpFolderOwner::Owner::Ours))) {
+    return enterListedFolder(name, made) && joinHere();
+}
+
+bool FtpSession::joinHere() {
+    if (!mayGoOn(m_journal->sendingBegins(Sender::Ftp, m_owner == FtpFolderOwner::Owner::Ours))) {
         m_inOrderFolder = false;
         return false;
     }
@@ -290,8 +347,18 @@ bool FtpSession::EnterOrderFolder() {
     }
     QString& name = m_transfer.ShemTikiya;
     name = OrderFolder(m_transfer.OrderFolder).name();
-    if (m_lists.List5.contains(name))
+    if (isKept() && hConnection) {
+        const auto entered = hConnection->setCurrentDirectory(name);
+        if (entered)
+            return lookAround(name, false) && joinHere();
+        const Failure& why = entered.failure();
+        if (why.passing || (why.kind != Failure::Kind::Refused && why.kind != Failure::Kind::AccessDenied)) {
+            trouble(LineStep::OrderFolder, why);
+            return false;
+        }
+    } else if (m_lists.List5.contains(name)) {
         return joinOrderFolder(name, false);
+    }
     // Names of another folder must not make the pass skip files of this one.
     m_lists.List6.clear();
     m_inFolder.clear();
@@ -318,14 +385,15 @@ bool FtpSession::EnterOrderFolder() {
     m_inOrderFolder = true;
     if (!made)
         keep(m_journal->sendingBegins(Sender::Ftp, false));
-    FillListFromNames(Target::List2, name);
+    if (!isKept())
+        FillListFromNames(Target::List2, name);
     tell(SendingMoment::Ready);
     return true;
 }
 
 bool FtpSession::FtpMakeOrderDir(const QString& name) {
     // After a program that ended before the answer, the next one finds an empty folder and takes it as the order's own.
-    if (hConnection && !isKept(m_journal->folderIsAsked(Sender::Ftp)))
+    if (hConnection && !mayGoOn(m_journal->folderIsAsked(Sender::Ftp)))
         return false;
     const auto made = hConnection ? hConnection->makeDirectory(name) : Result<void>(noLine());
     if (!made) {
@@ -335,6 +403,8 @@ bool FtpSession::FtpMakeOrderDir(const QString& name) {
         log(u" make remotedir fail"_s);
         return false;
     }
+    if (isKept())
+        return true;
     m_lists.List2.clear();
     ListRemoteChecked();
     FillListFromNames(Target::List2, name);
@@ -354,24 +424,33 @@ bool FtpSession::FtpSendFile(const QString& path) {
         log(u"sendfile-no-image selected"_s);
         return false;
     }
-    const QString name = LeafName(path);
     pump();
+    const Result<HostPath> local = beginPut(path);
+    if (m_unkept)
+        return false;
+    const auto sent = local ? hConnection->put(*local, LeafName(path)) : Result<void>(local.failure());
+    pump();
+    return endPut(path, sent);
+}
+
+Result<HostPath> FtpSession::beginPut(const QString& path) {
     const Files& files = m_platform.files;
     const DrivePath file(path);
     const auto local = files.drives().toHost(file);
     m_putBegun = true;
-    Result<void> sent = Failure{Failure::Kind::NotFound, path};
-    if (local && files.fileExists(file)) {
-        if (!isKept(m_journal->take(path)))
-            return false;
-        sent = hConnection->put(*local, name);
-        if (sent)
-            release(path);
-    }
-    pump();
-    if (sent)
+    if (!local || !files.fileExists(file))
+        return Failure{Failure::Kind::NotFound, path};
+    if (!mayGoOn(m_journal->take(path)))
+        return *m_unkept;
+    return *local;
+}
+
+bool FtpSession::endPut(const QString& path, const Result<void>& sent) {
+    if (sent) {
+        release(path);
         return true;
-    trouble(LineStep::Put, sent.failure(), name);
+    }
+    trouble(LineStep::Put, sent.failure(), LeafName(path));
     log(u"fail to up load"_s + path);
     m_lists.List7.append(path);
     PauseBar();
@@ -391,7 +470,7 @@ void FtpSession::keep(const Result<void>& written) {
 }
 
 // As built in a step that could not be kept is told, and the sending goes on.
-bool FtpSession::isKept(const Result<void>& written) {
+bool FtpSession::mayGoOn(const Result<void>& written) {
     if (written || !m_careful) {
         keep(written);
         return true;
@@ -510,6 +589,35 @@ void FtpSession::FillListFromNames(Target target, const QString& dir) {
         refill(m_lists.List6);
         break;
     }
+}
+
+std::unique_ptr<FtpConnection> FtpSession::lend() {
+    m_inOrderFolder = false;
+    return std::move(hConnection);
+}
+
+void FtpSession::takeBack(std::unique_ptr<FtpConnection> connection) {
+    if (!connection) {
+        FtpCloseConnection();
+        return;
+    }
+    hConnection = std::move(connection);
+    m_inOrderFolder = true;
+}
+
+std::function<Result<std::unique_ptr<FtpConnection>>()> FtpSession::opener() const {
+    const QStringList folders = foldersOfLab() + QStringList(m_transfer.ShemTikiya);
+    return [&internet = m_platform.internet, host = FtpHost, user = FtpUser, password = FtpPass,
+            channel = dataChannel(), folders] {
+        auto connection = internet.connectFtp(host, user, password, channel);
+        for (const QString& folder : folders) {
+            if (!connection)
+                break;
+            if (const auto entered = (*connection)->setCurrentDirectory(folder); !entered)
+                connection = entered.failure();
+        }
+        return connection;
+    };
 }
 
 void FtpSession::FtpCloseConnection() {

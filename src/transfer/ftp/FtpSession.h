@@ -11,6 +11,7 @@
 
 #include <QStringList>
 
+#include <functional>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -22,7 +23,9 @@ struct Platform;
 // One FTP session with the lab's server: opens, connects, enters the lab's folders, makes the order's folder, puts,
 // lists, deletes. It does not decide what to send. Each call blocks; events are pumped between calls.
 // Its states: closed, open (hOpen), connected (bActiveSession), in the order's folder. The sender runs through them
-// once for each file and once for each check, so that a broken connection costs at most the present file.
+// once for each file and once for each check, so that a broken connection costs at most the present file. Where the lab
+// keeps the session, once for a pass and its check, and again after a fault; each folder is entered by its name then,
+// and none but the order's own is listed.
 class FtpSession {
 public:
     FtpSession(SessionState& state, const Platform& platform, SendingEvents& events, SendingStop& stop,
@@ -50,6 +53,10 @@ public:
     void EnterFolderTK2();
     // The four steps above with their pauses. FolderOk: the lab's folder was found.
     void walkToLabFolder();
+    // The lab keeps the session from file to file.
+    bool isKept() const { return m_transfer.keptFtpSession; }
+    // The folders beside the order's into List5, for which a kept session has not asked. Leaves the order's folder.
+    void listOrderFolders();
 
     // True when the current directory is the one of the order folders.
     bool insideOrderBase() const;
@@ -59,6 +66,8 @@ public:
     // folder is another order's, with List6 unchanged.
     // made: the server has just answered well that it made the folder.
     bool enterListedFolder(const QString& name, bool made = false);
+    // The same where the connection stands in the order's folder.
+    bool listOrderFolder() { return lookAround(m_transfer.ShemTikiya, false); }
     bool inOrderFolder() const { return m_inOrderFolder; }
     // What the listing at entering the folder proves of files of the order, by FtpArrival.
     bool provesArrival() const { return m_arrival.decides(); }
@@ -74,6 +83,10 @@ public:
     // Puts one file, whose name stands in the order's state until the put is confirmed. A failed put is added to
     // LogList, List7 and List4Broken. False without a session, too.
     bool FtpSendFile(const QString& path);
+    // The two halves of it, between which the caller puts the file. The first gives the file to be put, or why there is
+    // nothing to put; where unkept() has a value then, nothing may be put. The second tells whether it was put well.
+    Result<HostPath> beginPut(const QString& path);
+    bool endPut(const QString& path, const Result<void>& sent);
     // So many files of the order were put well or skipped.
     void countFiles(int sent);
     // Writes List4Broken to kashloo.txt. A failed write is told once a pass.
@@ -90,6 +103,12 @@ public:
     const QString& unreadLine() const { return m_listing.unread; }
     enum class Target { List1, List2, List4, List5, List6 };
     void FillListFromNames(Target target, const QString& dir);
+
+    // Gives the connection that stands in the order's folder out of hand; takes back one that does, or none.
+    std::unique_ptr<FtpConnection> lend();
+    void takeBack(std::unique_ptr<FtpConnection> connection);
+    // Opens a further connection that stands in the order's folder, on whatever thread, without a word.
+    std::function<Result<std::unique_ptr<FtpConnection>>()> opener() const;
 
     void FtpCloseConnection(); // closes the connection and keeps the session
     void FtpCloseAll();
@@ -130,13 +149,22 @@ private:
     void tellOnce(bool& told, SendingMoment moment, int number = 0);
     void pump();
     void openFolder(const QString& name, int level);
+    bool connect();
+    void enterByNames();
+    bool lookAround(const QString& name, bool made);
+    bool joinHere();
+    QStringList foldersOfLab() const;
+    void tellFolder(int level);
+    Internet::DataChannel dataChannel() const {
+        return passive ? Internet::DataChannel::Passive : Internet::DataChannel::Active;
+    }
     bool FtpChangeDir(const QString& dir);
     void ClearListing();
     Result<FtpListing> find(EmptyFolder empty = EmptyFolder::IsListed);
     void listHere(EmptyFolder empty);
     bool joinOrderFolder(const QString& name, bool made);
     bool mayJoin(const QString& name, bool made);
-    bool isKept(const Result<void>& written);
+    bool mayGoOn(const Result<void>& written);
     void take(const FtpListing& listing);
     void FtpFatalError(const Failure& failure, const QString& source);
     void listHereAgain();

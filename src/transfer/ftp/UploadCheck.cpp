@@ -70,6 +70,11 @@ void UploadCheck::watch() {
 
 void UploadCheck::check(int attempt) {
     m_freshListing = false;
+    // A kept session whose pass had no fault.
+    if (m_session.inOrderFolder() && m_lists.List4Broken.isEmpty()) {
+        listServerFiles(Over::OpenConnection);
+        return;
+    }
     for (const Step step : stepsOf(attempt)) {
         if (m_stop.left || m_silent)
             return;
@@ -111,8 +116,9 @@ void UploadCheck::freshConnection() {
 bool UploadCheck::lookUp() {
     const QString& name = m_state.transfer.ShemTikiya;
     const QStringList before = m_lists.List6.items();
-    // Some servers cut a long listing.
-    if ((!m_lists.List5.contains(name) && !m_session.provesArrival()) || !m_session.enterListedFolder(name))
+    // Some servers cut a long listing, and a kept session has none.
+    const bool isListed = m_lists.List5.contains(name) || m_session.provesArrival() || m_session.isKept();
+    if (m_session.inOrderFolder() ? !m_session.listOrderFolder() : !isListed || !m_session.enterListedFolder(name))
         return false;
     unreadable = !m_session.unreadLine().isEmpty();
     if (!unreadable)
@@ -145,11 +151,16 @@ void UploadCheck::count() {
 }
 
 void UploadCheck::ListServerFiles() {
+    listServerFiles(Over::NewConnection);
+}
+
+void UploadCheck::listServerFiles(Over connection) {
     freshCount = false;
     unreadable = false;
     proof.reset();
     proven = Arrival::Part;
-    freshConnection();
+    if (connection == Over::NewConnection)
+        freshConnection();
     if (m_stop.left)
         return;
     if (!m_session.insideOrderBase()) {

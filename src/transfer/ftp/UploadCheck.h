@@ -34,6 +34,7 @@ public:
     // The steps of the check after attempt 1 to 4; they differ only in pauses and in closing the connection.
     void check(int attempt);
 
+    // Over a connection of its own.
     void ListServerFiles();
     void RecheckBroken();
     void DeleteBrokenFiles();
@@ -64,6 +65,8 @@ public:
 
 private:
     bool lookUp();
+    enum class Over { NewConnection, OpenConnection };
+    void listServerFiles(Over connection);
     void prove();
     Arrival orderThere();
     // Full paths of the order's files that are not among those of the sending.

@@ -1,27 +1,45 @@
 #include "transfer/ftp/UploadPass.h"
 
 #include "common/DrivePath.h"
+#include "common/HostFile.h"
 #include "order/BrokenFiles.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "platform/line/Internet.h"
 #include "transfer/delivery/UploadProgress.h"
+#include "transfer/ftp/UploadLines.h"
 
 #include <algorithm>
+#include <chrono>
+#include <utility>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-void UploadPass::run() {
+namespace {
+
+const QString sharedPicture = u"000.jpg"_s; // goes behind all other files
+constexpr std::chrono::milliseconds betweenPumps{10};
+constexpr std::chrono::milliseconds mostOpening{5'000};
+
+} // namespace
+
+void UploadPass::run(int attempt) {
     m_events.reached(SendingMoment::PassBegins);
     m_session.beginPass();
     m_stop.StopFlag = false;
     beginFiles();
+    m_lines = m_keeps && attempt == 1 ? m_transfer.ftpLines : 1;
     // The time since the last piece of an earlier pass tells nothing about the pace.
     LastPartTime = {};
-    for (int i = 0; i < m_lists.List3.count() && !m_stop.StopFlag && !m_stop.left; ++i) {
+    QSet<int> gone; // by several lines
+    for (int i = 0; i < m_lists.List3.count() && !ends(); ++i) {
+        if (mayGoByLines(i))
+            gone = goByLines(i);
+        if (ends() || gone.contains(i))
+            continue;
         m_events.progressed(i, m_lists.List3.count());
         UploadOneFile(i);
         tellPiece(i);
@@ -40,8 +58,22 @@ void UploadPass::beginFiles() {
     m_end.reset();
     m_silence.begin();
     m_skipped = 0;
-    m_keeps = m_transfer.keptFtpSession;
+    m_keeps = m_session.isKept();
+    m_lines = 1;
     m_running = true;
+    m_lengths.clear();
+    m_putting.clear();
+    m_all = m_before = m_put = 0;
+    m_pace.begin();
+    const QSet<QString> ofPass(m_lists.List3.items().begin(), m_lists.List3.items().end());
+    for (const QString& path : m_lists.List4Makor.items() + m_lists.List3.items()) {
+        if (m_lengths.contains(path))
+            continue;
+        const Result<qint64> length = m_platform.files.size(DrivePath(path));
+        m_lengths[path] = length ? *length : 0;
+        m_all += lengthOf(path);
+        m_before += ofPass.contains(path) ? 0 : lengthOf(path);
+    }
 }
 
 bool UploadPass::endEarly() {
@@ -56,6 +88,7 @@ bool UploadPass::endEarly() {
 }
 
 void UploadPass::watch() {
+    tellBytes();
     if (!m_running || m_end || m_stop.StopFlag || !m_silence.overAfter(m_platform, m_skipped))
         return;
     endSilent();
@@ -92,10 +125,116 @@ void UploadPass::tellPiece(int index) {
         return;
     const QDateTime now = m_platform.clock.now();
     std::optional<int> minutes;
-    if (!piece->last() && LastPartTime.isValid())
+    if (!m_session.isKept() && !piece->last() && LastPartTime.isValid())
         minutes = MinutesLeft(LastPartTime.secsTo(now), m_lists.List3.count() - 1 - index);
     LastPartTime = now;
     m_events.pieceSent(piece->share(), minutes);
+}
+
+// What the line has moved since tells of the files that are being put. All of them count as there only once they are
+// confirmed.
+void UploadPass::tellBytes() {
+    if (!m_running || !m_session.isKept())
+        return;
+    qint64 inHand = 0;
+    for (const QString& path : std::as_const(m_putting))
+        inHand += lengthOf(path);
+    const qint64 moved = m_platform.internet.bytesMoved() - m_counted;
+    const qint64 put = m_put + std::clamp<qint64>(moved, 0, std::max<qint64>(inHand - 1, 0));
+    m_pace.moved(put, m_platform.clock.running());
+    const qint64 there = std::min(m_before + m_skipped + put, m_all);
+    m_events.movedBytes(there, m_all, m_pace.minutes(m_all - there));
+}
+
+// Where the pass holds the order's log, it has to be confirmed before the others begin; it is the first of them.
+bool UploadPass::mayGoByLines(int index) const {
+    return m_lines > 1 && m_keeps && index > 0 && m_session.inOrderFolder() && m_done.contains(m_lists.List3.item(0)) &&
+           m_lists.List3.count() - index > 1;
+}
+
+// Gives the files that need no other try in this pass.
+QSet<int> UploadPass::goByLines(int from) {
+    const int count = m_lists.List3.count();
+    QSet<int> gone;
+    QList<int> waiting;
+    for (int i = from; i < count && !ends() && LeafName(m_lists.List3.item(i)) != sharedPicture; ++i) {
+        const QString path = m_lists.List3.item(i);
+        if (!liesThere(path, LeafName(path))) {
+            waiting += i;
+            continue;
+        }
+        begin(i);
+        skip(path);
+        m_events.reached(SendingMoment::FileDone, i + 1);
+        gone += i;
+    }
+    const int most = std::exchange(m_lines, 1);
+    if (waiting.isEmpty() || ends())
+        return gone;
+    UploadLines lines(m_session.opener(), std::min(most, static_cast<int>(waiting.size())), m_session.lend());
+    const auto settleEnded = [&] {
+        if (ends())
+            m_platform.internet.abort();
+        const auto ended = lines.wait(betweenPumps);
+        m_platform.pump.pump();
+        if (!ended)
+            return;
+        const QString path = m_lists.List3.item(ended->number);
+        BrokenBefore = m_lists.List4Broken.count();
+        if (settle(path, m_session.endPut(path, ended->result)))
+            ++m_putsOfSession;
+        else if (ended->second)
+            m_keeps = false;
+        m_events.reached(SendingMoment::FileDone, ended->number + 1);
+        tellPiece(ended->number);
+    };
+    while (m_keeps && !waiting.isEmpty() && !ends() && (lines.canTake() || lines.isPutting() || lines.isOpening())) {
+        while (!waiting.isEmpty() && !ends() && lines.canTake()) {
+            gone += waiting.front();
+            handOut(lines, waiting.takeFirst());
+            readAheadOf(waiting.value(0, count));
+        }
+        settleEnded();
+    }
+    while (lines.isPutting())
+        settleEnded();
+    m_session.takeBack(lines.takeOne());
+    // A server that lets no more in may keep the others waiting for their greeting.
+    const auto until = m_platform.clock.running() + mostOpening;
+    while (lines.isOpening() && !ends() && m_platform.clock.running() < until)
+        settleEnded();
+    if (lines.isOpening()) {
+        m_session.FtpCloseConnection();
+        m_platform.internet.abort();
+    }
+    return gone;
+}
+
+void UploadPass::handOut(UploadLines& lines, int index) {
+    begin(index);
+    const QString path = m_lists.List3.item(index);
+    const Result<HostPath> local = m_session.beginPut(path);
+    if (m_session.unkept()) {
+        endUnkept();
+    } else if (local) {
+        m_putting += path;
+        lines.put(index, *local, LeafName(path));
+    } else {
+        BrokenBefore = m_lists.List4Broken.count();
+        settle(path, m_session.endPut(path, local.failure()));
+    }
+}
+
+void UploadPass::readAheadOf(int index) const {
+    if (const auto next = m_platform.files.host(DrivePath(m_lists.List3.item(index))); next && m_session.isKept())
+        readAhead(*next);
+}
+
+void UploadPass::begin(int index) {
+    m_lists.List3.setCurrentIndex(index);
+    CurrentIndex = index;
+    m_events.progressed(index, m_lists.List3.count());
+    m_events.sending(index, m_lists.List3.count(), LeafName(m_lists.List3.item(index)));
 }
 
 void UploadPass::closeWithPauses() {
@@ -116,7 +255,8 @@ void UploadPass::UploadOneFile(int index) {
     // With a server that ends each session after its first put, every second file would fail.
     if (!good && m_putsOfSession == 1)
         m_keeps = false;
-    if (!m_keeps || !good || m_stop.StopFlag || index == m_lists.List3.lastIndex())
+    // Behind a last file that went well the check goes on where the session stands.
+    if (!m_keeps || !good || m_stop.StopFlag)
         closeWithPauses();
 }
 
@@ -145,6 +285,8 @@ bool UploadPass::reachOrderFolder() {
         const bool basketKept = !m_session.journal()->state().items.isEmpty();
         const Failure why{Failure::Kind::InUse, u"the folder on the server holds another order"_s};
         m_session.log(u' ' + why.message);
+        if (basketKept)
+            m_session.listOrderFolders(); // for the number under which it is prepared again
         endBy(basketKept ? SendingPhase::NumberTaken : SendingPhase::CallLab, LineStep::ForeignFolder, why);
     }
     if (m_stop.StopFlag)
@@ -183,16 +325,18 @@ bool UploadPass::send(const QString& path) {
     const QString name = LeafName(path);
     bool good = true;
     m_events.sending(CurrentIndex, m_lists.List3.count(), name);
-    if (liesThere(path, name)) {
-        if (const Result<qint64> length = m_platform.files.size(DrivePath(path)))
-            m_skipped += *length;
-        countDone(path);
-        m_events.reached(SendingMoment::Skipped);
-    } else {
-        good = put(path, name);
-    }
+    if (liesThere(path, name))
+        skip(path);
+    else
+        good = put(CurrentIndex);
     m_events.reached(SendingMoment::FileDone, CurrentIndex + 1);
     return good;
+}
+
+void UploadPass::skip(const QString& path) {
+    m_skipped += lengthOf(path);
+    countDone(path);
+    m_events.reached(SendingMoment::Skipped);
 }
 
 void UploadPass::countDone(const QString& path) {
@@ -212,25 +356,43 @@ void UploadPass::confirm(const QString& path) {
     m_session.release(path);
 }
 
-bool UploadPass::put(const QString& path, const QString& name) {
+bool UploadPass::put(int index) {
+    const QString path = m_lists.List3.item(index);
     TextList& broken = m_lists.List4Broken;
     BrokenBefore = broken.count();
-    if (!m_session.FtpSendFile(path)) {
-        endUnkept();
-        m_inHand.removeAll(path);
-        if (broken.count() > BrokenBefore)
-            m_session.keepBrokenFiles();
+    m_putting = {path};
+    m_counted = m_platform.internet.bytesMoved();
+    readAheadOf(index + 1);
+    if (!settle(path, m_session.FtpSendFile(path)))
         return false;
-    }
     ++m_putsOfSession;
-    if (IsBroken(broken, name))
-        confirm(path);
-    countDone(path);
     if (!m_session.lineEndsChanged(path))
         return true;
     broken.append(path);
     m_session.keepBrokenFiles();
     endBy(SendingPhase::CallLab, LineStep::ServerChanges, changed());
+    return true;
+}
+
+// What follows a put, which was confirmed or not.
+bool UploadPass::settle(const QString& path, bool sent) {
+    m_putting.remove(path);
+    if (m_putting.isEmpty())
+        m_counted = m_platform.internet.bytesMoved();
+    if (!sent) {
+        endUnkept();
+        m_inHand.removeAll(path);
+        if (m_lists.List4Broken.count() > BrokenBefore)
+            m_session.keepBrokenFiles();
+        return false;
+    }
+    if (!m_putting.isEmpty())
+        m_counted += lengthOf(path);
+    m_put += lengthOf(path);
+    if (IsBroken(m_lists.List4Broken, LeafName(path)))
+        confirm(path);
+    countDone(path);
+    tellBytes();
     return true;
 }
 

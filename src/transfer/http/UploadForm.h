@@ -105,6 +105,7 @@ private:
     void progressed(int index, int count) override;
     void sending(int index, int count, const QString& name) override;
     void pieceSent(double, std::optional<int>) override {}
+    void movedBytes(qint64, qint64, std::optional<int>) override {}
     void failed(LineStep step, const Failure& failure, const QString& subject) override;
     void notKept(const Failure& failure) override;
     void enteredFolder(int, const QString&, const QString&) override {}

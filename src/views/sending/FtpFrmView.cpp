@@ -47,6 +47,7 @@ void FtpFrmView::makeProgress() {
             centred(label(c.Label3, "title")),
             {m_pause, 0, Qt::AlignHCenter},
             centred(label(c.Label4File, "muted")),
+            centred(lineLabel(c.Label4Bytes, "muted")),
             centred(label(c.Label34, "strong")),
             {m_pieces, 0, Qt::AlignHCenter},
             minutes,
