@@ -253,24 +253,24 @@ struct ByLines : Line {
         under += name;
         most = std::max(most, under.size());
         alone[name] = under.size() == 1;
-        told.notify_all();
+        change.notify_all();
         if (name == names.first() || name == names.last())
             EXPECT_TRUE(alone[name]) << name.toStdString();
         else
-            told.wait_for(lock, std::chrono::milliseconds(200), [&] { return most >= 3; });
+            change.wait_for(lock, std::chrono::milliseconds(200), [&] { return most >= 3; });
         if (most == 3 && !std::exchange(met, true) && whenAllPut)
             whenAllPut();
         under.removeAll(name);
     }
     OrderState kept() const {
-        const Result<OrderState> state = ReadOrderState(test.files, OrderFolder(folder));
-        return state ? *state : OrderState();
+        const Result<OrderState> read = ReadOrderState(test.files, OrderFolder(folder));
+        return read ? *read : OrderState();
     }
 
     const QStringList names{u"log.txt"_s, u"1"_s, u"2"_s, u"3"_s, u"4"_s, u"5"_s, u"6"_s, u"000.jpg"_s};
     std::function<void()> whenAllPut;
     std::mutex mutex;
-    std::condition_variable told;
+    std::condition_variable change;
     QStringList under;
     QMap<QString, bool> alone;
     qsizetype most = 0;
