@@ -311,7 +311,14 @@ TEST_F(FtpFrmTest, AKeptSessionTellsItsWayInBytesAndAllOfThemOnlyOnceTheyHaveArr
         shares[name] = rig.page().controls().percent;
         atTheEnd = rig.page().controls().Label4Bytes.visible ? rig.page().controls().Label4Bytes.text : QString();
     };
-    rig.send();
+    int most = 0;
+    rig.start();
+    QObject::connect(&rig.page(), &Page::changed, &rig.page(), [&] {
+        if (rig.page().phase() <= SendingPhase::Checking)
+            most = std::max(most, rig.page().controls().percent);
+    });
+    rig.countDown();
+    EXPECT_EQ(most, 99);
     EXPECT_EQ(shares[FtpFrmRig::log()], 0);
     EXPECT_EQ(shares[FtpFrmRig::second()], 74);
     EXPECT_EQ(shares[FtpFrmRig::proof()], 99);

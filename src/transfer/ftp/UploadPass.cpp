@@ -172,6 +172,7 @@ QSet<int> UploadPass::goByLines(int from) {
     if (waiting.isEmpty() || ends())
         return gone;
     UploadLines lines(m_session.opener(), std::min(most, static_cast<int>(waiting.size())), m_session.lend());
+    int endedEarly = 0; // sessions, behind their first file
     const auto settleEnded = [&] {
         if (ends())
             m_platform.internet.abort();
@@ -183,7 +184,7 @@ QSet<int> UploadPass::goByLines(int from) {
         BrokenBefore = m_lists.List4Broken.count();
         if (settle(path, m_session.endPut(path, ended->result)))
             ++m_putsOfSession;
-        else if (ended->second)
+        else if (ended->second && ++endedEarly > 1)
             m_keeps = false;
         m_events.reached(SendingMoment::FileDone, ended->number + 1);
         tellPiece(ended->number);
