@@ -47,7 +47,7 @@ TEST_P(EditorLook, ShowsEachToolWholeAndInReach) {
     go(walk, u"Image16 Image13 :32-tones"_s);
     expectBesidePaper(walk, u"Frame3"_s);
     // Each press elsewhere closes the tones, and their own button does.
-    for (const char* elsewhere : {"Strip(0)", "PicPic", "Image13"}) {
+    for (const char* elsewhere : {"Image125", "Image145", "PicPic", "Image13"}) {
         if (!walk.pressable(editor, u"Frame3"_s))
             go(walk, u"Image13"_s);
         go(walk, QString::fromLatin1(elsewhere));
