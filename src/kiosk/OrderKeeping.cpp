@@ -1,5 +1,6 @@
 #include "kiosk/OrderKeeping.h"
 
+#include "common/FirstFailure.h"
 #include "common/ListOutput.h"
 #include "order/FinishedOrder.h"
 #include "order/OrderFolder.h"
@@ -103,7 +104,7 @@ Result<void> OrderKeeping::look() {
     const int keepPrints = m_state.kiosk.keepDays;
     const int keepFolder = std::max(m_state.kiosk.keepLogDays, keepPrints);
     QMap<QString, int> arrived;
-    Result<void> outcome;
+    FirstFailure steps;
     for (const QString& name : files.folders(orders)) {
         const OrderFolder folder(orders / name);
         const Result<OrderState> order = ReadOrderState(files, folder);
@@ -112,17 +113,14 @@ Result<void> OrderKeeping::look() {
         const int since = m_arrived.value(name, m_days.lived);
         arrived[name] = since;
         const int days = believed && m_state.Careful ? m_days.lived - since : 0;
-        Result<void> done;
         if (days >= keepFolder)
-            done = files.removeTree(folder.path());
+            steps.note(files.removeTree(folder.path()));
         else if (days >= keepPrints)
-            done = removePrints(folder);
-        if (outcome && !done)
-            outcome = done;
+            steps.note(removePrints(folder));
     }
     m_arrived = arrived;
-    const Result<void> kept = write();
-    return outcome ? kept : outcome;
+    steps.note(write());
+    return steps.outcome();
 }
 
 } // namespace lumora

@@ -1,5 +1,6 @@
 #include "order/KioskOffer.h"
 
+#include "common/FirstFailure.h"
 #include "order/OrderJournal.h"
 #include "platform/files/Files.h"
 
@@ -22,14 +23,12 @@ QString endOf(const QString& telephone) {
 
 template <class Step>
 Result<void> withEach(const QList<UnfinishedOrder>& orders, const Files& files, const Step& step) {
-    Result<void> outcome;
+    FirstFailure steps;
     for (const UnfinishedOrder& order : orders) {
-        const Result<OrderState> now = ReadOrderState(files, order.folder);
-        const Result<void> done = now ? step(order.folder, *now) : Result<void>(); // the staff decides about it
-        if (outcome && !done)
-            outcome = done;
+        if (const Result<OrderState> now = ReadOrderState(files, order.folder)) // else the staff decides about it
+            steps.note(step(order.folder, *now));
     }
-    return outcome;
+    return steps.outcome();
 }
 
 } // namespace

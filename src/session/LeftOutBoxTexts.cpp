@@ -33,8 +33,8 @@ QString LeftOutText(const SessionState& state) {
     if (count == 0)
         return {};
     if (count == 1)
-        return state.wording(u"תמונה אחת שבחרת אינה בהזמנה.", u"1 picture that you chose is not in the order.");
-    return state.wording(u"%1 תמונות שבחרת אינן בהזמנה.", u"%1 pictures that you chose are not in the order.")
+        return state.wording(u"תמונה אחת שבחרתם אינה בהזמנה.", u"1 picture that you chose is not in the order.");
+    return state.wording(u"%1 תמונות שבחרתם אינן בהזמנה.", u"%1 pictures that you chose are not in the order.")
         .arg(count);
 }
 

@@ -1,3 +1,4 @@
+#include "common/Warning.h"
 #include "session/SessionState.h"
 #include "session/SharedWords.h"
 
@@ -42,6 +43,16 @@ QString failureWords(const SessionState& state, const Failure& failure, const Dr
     default:
         return state.wording(u"תקלה לא צפויה", u"An unexpected fault");
     }
+}
+
+QString warnedWords(const SessionState& state, const Failure& failure, const DrivePath& file) {
+    writeWarning(failure.message);
+    return failureWords(state, failure, file);
+}
+
+QString askForHelp(const SessionState& state) {
+    return state.kiosk.on ? state.wording(u"נא לפנות לצוות.", u"Please ask the staff.")
+                          : state.wording(u"נא לפנות לחנות.", u"Please ask the shop.");
 }
 
 QString shortList(const SessionState& state, const QStringList& items, qsizetype most, const QString& between) {

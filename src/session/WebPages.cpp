@@ -4,6 +4,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "session/SessionState.h"
+#include "session/SharedWords.h"
 
 namespace lumora {
 
@@ -26,11 +27,9 @@ void WebPages::tellNotOpened(const QString& url) const {
                 m_state.wording(u"אפשר לפתוח את הדף במכשיר אחר: %1", u"You can open this page on another device: %1")
                     .arg(url.trimmed());
     const QString phone = m_state.profile.LabPhone.trimmed();
-    text += u'\n' +
-            (phone.isEmpty()
-                 ? m_state.wording(u"אפשר גם לשאול את הצוות.", u"Or please ask the staff.")
-                 : m_state.wording(u"אפשר גם לשאול את הצוות, או בטלפון: %1", u"Or please ask the staff, or call: %1")
-                       .arg(phone));
+    text += u'\n' + askForHelp(m_state);
+    if (!phone.isEmpty())
+        text += u' ' + m_state.wording(u"טלפון: %1", u"Telephone: %1").arg(phone);
     m_platform.dialogs.message(text);
 }
 

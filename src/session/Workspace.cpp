@@ -90,8 +90,16 @@ DrivePath toneCopy(const SessionState& state) {
     return root(state) / u"bw.bmp";
 }
 
+DrivePath previewCopy(const SessionState& state) {
+    return root(state) / u"0.bmp";
+}
+
 DrivePath proofPicture(const SessionState& state) {
     return root(state) / u"000.jpg";
+}
+
+DrivePath summaryPicture(const SessionState& state) {
+    return root(state) / u"001.jpg";
 }
 
 DrivePath handOverTexts(const SessionState& state) {

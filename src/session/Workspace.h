@@ -26,7 +26,9 @@ DrivePath orders(const SessionState& state);         // !!000: staging, one sub-
 DrivePath scratchPicture(const SessionState& state); // ^^^.jpg, the picture of the current step
 DrivePath counter(const SessionState& state);        // vedron\mispar.txt
 DrivePath toneCopy(const SessionState& state);       // bw.bmp: the grey picture that the latest toned print came from
+DrivePath previewCopy(const SessionState& state);    // 0.bmp: the editor's picture
 DrivePath proofPicture(const SessionState& state);   // 000.jpg
+DrivePath summaryPicture(const SessionState& state); // 001.jpg
 DrivePath handOverTexts(const SessionState& state);  // Tik4txt: the lines of the basket
 // pratim.txt, pratim2.txt and pratim3.txt: details of a customer, of an album's photographer, of a quick order.
 std::array<DrivePath, 3> detailStores(const SessionState& state);

@@ -156,7 +156,7 @@ TEST_F(TheDoor, KeepsAnOrderWhosePicturesCouldNotBeMade) {
         waitUntil([&] { return machine.dialogs.messages.size() == told && !page.controls().doorPanel.visible; });
     }
     EXPECT_EQ(machine.dialogs.messages.last(),
-              u"The picture d.heic could not be made ready.\nWhat is ready stays. Please ask the staff.\n"
+              u"The picture d.heic could not be made ready.\nWhat is ready stays. Please ask the shop.\n"
               u"A program is missing on this computer"_s);
     EXPECT_EQ(page.controls().List1.count(), 1);
     EXPECT_FALSE(page.controls().Frame4.visible);

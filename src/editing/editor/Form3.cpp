@@ -1,6 +1,5 @@
 #include "editing/editor/Form3.h"
 
-#include "common/Warning.h"
 #include "imaging/drawing/Drawing.h"
 #include "order/KeptPictures.h"
 #include "platform/Dialogs.h"
@@ -64,10 +63,9 @@ void Form3::draw() {
             std::swap(Picture2Box.width, Picture2Box.height);
     } else {
         Picture2Box = {};
-        writeWarning(picture.failure().message);
         m_platform.dialogs.message(
             m_state.wording(u"לא ניתן לפתוח את התמונה %1.\n%2", u"The picture %1 can't be opened.\n%2")
-                .arg(m_path.leaf(), failureWords(m_state, picture.failure(), m_path)));
+                .arg(m_path.leaf(), warnedWords(m_state, picture.failure(), m_path)));
     }
     unreadable.visible = Picture2.isNull();
     Q_EMIT changed();

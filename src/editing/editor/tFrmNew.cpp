@@ -2,7 +2,6 @@
 
 #include "common/FixedText.h"
 #include "common/PaperSize.h"
-#include "common/Warning.h"
 #include "editing/editor/BigPics.h"
 #include "editing/render/EditedPicture.h"
 #include "order/EditRecord.h"
@@ -161,9 +160,8 @@ bool tFrmNew::LoadWorkBitmap(const DrivePath& path) {
     Result<EditedPreview> opened =
         EditedPreview::open(file, paper, PreviewZoom, EditedPreview::Tone::Colour, largestScale);
     if (!opened) {
-        writeWarning(opened.failure().message);
         tell(u"לא ניתן לפתוח את התמונה לעריכה"_s, u"The picture can't be opened for editing"_s,
-             failureWords(m_state, opened.failure(), path));
+             warnedWords(m_state, opened.failure(), path));
         return false;
     }
     surfaces().open(std::move(*opened));
@@ -177,7 +175,7 @@ void tFrmNew::writeWorkFile() {
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
     workPicture()->workPicture().image().save(&buffer, "BMP");
-    const Result<void> written = m_platform.files.writePassing(WorkspacePaths::root(m_state) / u"0.bmp", bytes);
+    const Result<void> written = m_platform.files.writePassing(WorkspacePaths::previewCopy(m_state), bytes);
     // Editing needs no work file, so its failure is told once.
     if (!written && !m_workFileFailed)
         m_platform.dialogs.message(written.failure().message);

@@ -1,7 +1,6 @@
 #include "editing/redeye/RedI.h"
 
 #include "common/FixedText.h"
-#include "common/Warning.h"
 #include "editing/editor/tFrmNew.h"
 #include "editing/redeye/RedOverview.h"
 #include "order/EditRecord.h"
@@ -109,9 +108,8 @@ void RedI::open(const DrivePath& path) {
     });
     endWait();
     if (!opened) {
-        writeWarning(opened.failure().message);
         tellFailure(u"לא ניתן לפתוח את התמונה לתיקון.\n%1"_s, u"The picture can't be opened for correction.\n%1"_s,
-                    {opened.failure().kind, failureWords(m_state, opened.failure(), path)});
+                    {opened.failure().kind, warnedWords(m_state, opened.failure(), path)});
         close();
         return;
     }

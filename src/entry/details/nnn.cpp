@@ -283,7 +283,7 @@ void nnn::showCoupon(std::optional<int> limit) {
     Label4kpn.text = QString::number(*limit);
     Label4kpn.visible = *limit > 0;
     if (*limit == 0 && m_state.coupon.HaKoopon == 1)
-        tell(u"הקופון תקף רק לגדלים 10/15 ו-20/30 שעל הכרטיסים.\nלגודל שבחרת אין קופון.",
+        tell(u"הקופון תקף רק לגדלים 10/15 ו-20/30 שעל הכרטיסים.\nלגודל שבחרתם אין קופון.",
              u"The coupon is good for the sizes 10/15 and 20/30 on the cards.\nThe size you chose has none.");
 }
 

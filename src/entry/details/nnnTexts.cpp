@@ -85,7 +85,7 @@ void nnn::setTexts() {
                              {Option4, u"כל התמונה על הנייר, עם שוליים", u"The whole picture, with margins"},
                              {Option5, u"מילוי כל הנייר, עם חיתוך", u"Fill the paper, edges are cut"},
 
-                             {LabelChoice, u"מה שבחרת", u"What you chose"},
+                             {LabelChoice, u"מה שבחרתם", u"What you chose"},
                              {LabelCheck1, u"לפני שממשיכים", u"Before going on"},
                              {Check1, u"מסכים תנאי שימוש", u"I agree to the terms of use"},
                              {Command29, u"קרא תנאי שימוש", u"Read the terms of use"},

@@ -16,8 +16,21 @@ Havharot::Havharot(const SessionState& state, const Platform& platform, PageChai
     , m_chain(chain) {}
 
 void Havharot::setTexts() {
-    Command2.visible = Command3.visible = Command4.visible = !m_plain;
-    if (m_plain)
+    const bool isStaffs = m_state.closedToCustomers();
+    Command2.visible = Command3.visible = Command4.visible = !m_plain && !isStaffs;
+    if (!m_plain && isStaffs)
+        setCaptions(m_state, {
+                                 {Title, u"הבהרות ואזהרות", u"Clarifications and warnings"},
+                                 {Label1,
+                                  u"התמונות שלכם נקראות בלבד ואינן משתנות.\n"
+                                  u"הזמנה שלא נשלחה נשארת במכשיר זה עד שתישלח.\n"
+                                  u"אין לנתק כרטיס זיכרון בזמן הכנת ההזמנה.",
+                                  u"Your pictures are only read and never changed.\n"
+                                  u"An order that was not sent stays on this machine until it is.\n"
+                                  u"Do not pull out a memory card while an order is being prepared."},
+                                 {Command1, u"המשך", u"Go on"},
+                             });
+    else if (m_plain)
         setCaptions(m_state, {
                                  {Title, u"שירותים נוספים", u"More services"},
                                  {Label1, u"בתחנה זו אין עדיין שירותים נוספים.",

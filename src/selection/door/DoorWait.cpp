@@ -47,9 +47,9 @@ bool DoorWait::tellsAtOnce(const QString& path) {
 QString DoorWait::notMadeWords(const QString& path) const {
     const DrivePath picture(m_door.shown(path));
     return m_state
-        .wording(u"התמונה %1 לא הוכנה להזמנה.\nמה שכבר הוכן נשמר. נא לפנות לצוות.\n%2",
-                 u"The picture %1 could not be made ready.\nWhat is ready stays. Please ask the staff.\n%2")
-        .arg(picture.leaf(), failureWords(m_state, m_door.failureOf(path), picture));
+        .wording(u"התמונה %1 לא הוכנה להזמנה.\nמה שכבר הוכן נשמר. %2\n%3",
+                 u"The picture %1 could not be made ready.\nWhat is ready stays. %2\n%3")
+        .arg(picture.leaf(), askForHelp(m_state), warnedWords(m_state, m_door.failureOf(path), picture));
 }
 
 QString DoorWait::takenOutWords() {

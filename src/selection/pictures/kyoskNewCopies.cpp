@@ -1,6 +1,5 @@
 // The page of pictures: what is chosen from a card is copied, so that the card may go.
 #include "common/FixedText.h"
-#include "common/Warning.h"
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "selection/CardWords.h"
@@ -108,13 +107,12 @@ void kyoskNew::copySettled(const QString& path) {
 
 void kyoskNew::tellNotKept(const Failure& why, const DrivePath& picture) {
     m_notKeptTold = true;
-    writeWarning(why.message);
     m_platform.dialogs.message(
         m_state
             .wording(
                 u"לא ניתן להעתיק את התמונות מהכרטיס.\nנא להשאיר את הכרטיס עד סוף ההזמנה.\n%1",
                 u"The pictures can't be copied from the card.\nPlease leave the card in until the order is done.\n%1")
-            .arg(failureWords(m_state, why, picture)));
+            .arg(warnedWords(m_state, why, picture)));
 }
 
 QString kyoskNew::namesOf(const QStringList& paths) const {

@@ -1,5 +1,4 @@
 // The page of pictures: those that are no ordinary JPEG files, and are made ready in the background.
-#include "common/Warning.h"
 #include "order/DoorFolders.h"
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
@@ -101,7 +100,6 @@ void kyoskNew::pictureSettled(const QString& path) {
 }
 
 void kyoskNew::tellNotMade(const QString& path) {
-    writeWarning(m_door->failureOf(path).message);
     m_platform.dialogs.message(m_wait.notMadeWords(path));
 }
 

@@ -68,7 +68,7 @@ void kyoskNew::setBrowserTexts() {
             {copiesDone, u"אישור", u"OK"},
             {emptyHead, u"מאיפה ניקח את התמונות?", u"Where are your pictures?"},
             {firstFolder, u"פתח תיקיית תמונות", u"Open a folder of pictures"},
-            {doorNote, u"מכינים את התמונות שבחרת", u"Making your pictures ready"},
+            {doorNote, u"מכינים את התמונות שבחרתם", u"Making your pictures ready"},
             {doorBack, u"חזרה לתמונות", u"Back to the pictures"},
             {Frame2, u"עזרה", u"Help"},
             {helpClose, u"סגור", u"Close"},
