@@ -92,17 +92,10 @@ class Bench {
 public:
     explicit Bench(Kind kind)
         : m_kind(kind)
-        , m_platform{m_machine.files,
-                     m_machine.dialogs,
-                     m_machine.noInternet,
-                     m_machine.mail,
-                     m_machine.shell,
-                     m_machine.clock,
-                     m_pump,
-                     m_machine.volume,
-                     m_machine.instances,
-                     m_machine.cards,
-                     {}}
+        , m_platform{m_machine.files, m_machine.dialogs, m_machine.noInternet,
+                     m_machine.mail,  m_machine.shell,   m_machine.clock,
+                     m_pump,          m_machine.volume,  m_machine.instances,
+                     m_machine.cards, m_machine.printer, {}}
         , m_chain(m_pump) {
         const HostPath folder = makeFolder("C:\\pics");
         makeFolder("C:\\vedron");

@@ -12,6 +12,7 @@
 #include "platform/NetworkCards.h"
 #include "platform/Platform.h"
 #include "platform/QtEventPump.h"
+#include "platform/QueuePrinter.h"
 #include "platform/SystemClock.h"
 #include "platform/files/Drives.h"
 #include "platform/files/Files.h"
@@ -61,8 +62,8 @@ struct Program::Parts {
         , chain(pump)
         , window(chain, state)
         , dialogs(window, state, platform)
-        , platform{files, dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances,
-                   cards, doorProgram()}
+        , platform{files,   dialogs,      line ? *line : internet, mail, shell, clock, pump, volume, instances, cards,
+                   printer, doorProgram()}
         , waiting(state, platform, chain, deployment)
         , idle(deployment.kiosk, platform, chain)
         , staffCode(state, files, clock)
@@ -103,6 +104,7 @@ struct Program::Parts {
     QtEventPump pump;
     PocoInternet internet;
     SmtpMail mail;
+    QueuePrinter printer;
     DesktopShell shell;
     PageChain chain;
     MainWindow window;

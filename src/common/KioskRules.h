@@ -11,6 +11,7 @@ struct KioskRules {
     QString code;          // of the staff, as "lumora --kiosk-code" prints it; empty: there is no way in
     int keepDays = 30;     // of the print files of an order that has arrived
     int keepLogDays = 365; // of its folder
+    QString printer;       // the print queue of the slips; empty: there are none
 
     bool operator==(const KioskRules&) const = default;
 };

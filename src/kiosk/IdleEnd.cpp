@@ -55,7 +55,7 @@ IdleWatch::Silence IdleEnd::silence() const {
     if (!front || (!waits && (m_chain.isAnyWorking() || m_platform.pump.pumping())))
         return MayNotEnd;
     if (front->id() != PageId::hatchala)
-        return IsAsked;
+        return front->isAtRest() && !waits ? IsEnough : IsAsked;
     return front->isUntouched() && !waits ? NeedsNone : IsEnough;
 }
 

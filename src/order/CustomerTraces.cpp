@@ -1,5 +1,6 @@
 #include "order/CustomerTraces.h"
 
+#include "common/FirstFailure.h"
 #include "order/DoorFolders.h"
 #include "platform/Instances.h"
 #include "platform/Machine.h"
@@ -16,7 +17,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Removes what is there, and keeps the first failure.
+// Removes what is there.
 class Removal {
 public:
     explicit Removal(const Files& files)
@@ -24,26 +25,21 @@ public:
 
     void file(const DrivePath& path) {
         if (m_files.fileExists(path))
-            note(m_files.removeFile(path));
+            m_steps.note(m_files.removeFile(path));
     }
     void files(const DrivePath& folder, const QString& patterns) {
         for (const QString& name : m_files.storedNames(folder, patterns))
-            note(m_files.removeFile(folder / name));
+            m_steps.note(m_files.removeFile(folder / name));
     }
     void tree(const DrivePath& folder) {
         if (m_files.folderExists(folder))
-            note(m_files.removeTree(folder));
+            m_steps.note(m_files.removeTree(folder));
     }
-    Result<void> outcome() const { return m_outcome; }
+    Result<void> outcome() const { return m_steps.outcome(); }
 
 private:
-    void note(const Result<void>& removed) {
-        if (m_outcome && !removed)
-            m_outcome = removed;
-    }
-
     const Files& m_files;
-    Result<void> m_outcome;
+    FirstFailure m_steps;
 };
 
 } // namespace
@@ -59,6 +55,7 @@ void CustomerTraces::clearSession() const {
     SessionState fresh;
     fresh.DiskRoot = m_state.DiskRoot;
     fresh.waitingOrders = m_state.waitingOrders;
+    fresh.slipTrouble = m_state.slipTrouble;
     fresh.handOver.notice = m_state.handOver.notice;
     m_state = std::move(fresh);
 }
@@ -69,8 +66,8 @@ Result<void> CustomerTraces::clearFiles() const {
     const DrivePath root = WorkspacePaths::root(m_state);
     for (const DrivePath& path : WorkspacePaths::detailStores(m_state))
         removal.file(path);
-    for (const DrivePath& path :
-         {root / u"0.bmp", WorkspacePaths::toneCopy(m_state), WorkspacePaths::proofPicture(m_state), root / u"001.jpg"})
+    for (const DrivePath& path : {WorkspacePaths::previewCopy(m_state), WorkspacePaths::toneCopy(m_state),
+                                  WorkspacePaths::proofPicture(m_state), WorkspacePaths::summaryPicture(m_state)})
         removal.file(path);
     removal.tree(WorkspacePaths::handOverTexts(m_state));
     removal.files(root, u"filelist*.txt"_s); // what the web server has of the order

@@ -247,6 +247,12 @@ Result<void> OrderJournal::tried(const BothLanguages& why) {
     return keep(next);
 }
 
+Result<void> OrderJournal::held(bool isHeld) {
+    OrderState next = m_state;
+    next.held = isHeld;
+    return keep(next);
+}
+
 Result<void> OrderJournal::lapsed() {
     OrderState next = m_state;
     next.lapsed = true;

@@ -68,6 +68,8 @@ public:
     // A sending by itself has ended without the order's arrival; the staff wants no more of them.
     Result<void> tried(const BothLanguages& why);
     Result<void> givenUp();
+    // The customer has stopped the count before the sending, or lets it go on.
+    Result<void> held(bool isHeld);
     // Its customer has gone.
     Result<void> lapsed();
     // The order that this one was prepared again from is gone, or is one of its own.

@@ -100,6 +100,8 @@ bool takeEntry(OrderState& state, const QString& key, const QString& value) {
         return takeTruth(value, state.fewerAgreed);
     if (key == u"GivenUp")
         return takeTruth(value, state.givenUp);
+    if (key == u"Held")
+        return takeTruth(value, state.held);
     if (key == u"Lapsed")
         return takeTruth(value, state.lapsed);
     if (key == u"SentBefore")
@@ -178,6 +180,8 @@ QByteArray OrderState::write() const {
     }
     if (phase < Phase::Arrived && givenUp)
         writer.truth("GivenUp", true);
+    if (phase < Phase::Sending && held)
+        writer.truth("Held", true);
     if (phase < Phase::Reported && lapsed)
         writer.truth("Lapsed", true);
     for (const QString& path : filesInHand)

@@ -60,6 +60,7 @@ struct OrderState {
     int tries = 0;
     BothLanguages why;
     bool givenUp = false; // the staff wants it sent by itself no more
+    bool held = false;    // the customer has stopped the count before its sending
     bool lapsed = false;  // on a kiosk: its customer has gone, and it is offered to nobody
     QString replaces;     // folder name of the order that this one was prepared again from
     QStringList items;    // lines of the basket; kept until the sending begins

@@ -18,9 +18,12 @@ using std::chrono::minutes;
 
 constexpr std::array pauses = {minutes(1), minutes(2), minutes(5), minutes(15), minutes(60)};
 
+// A person has the word: the customer has stopped it, or pictures were left out of it.
 bool waitsForAnswer(const SessionState& state, const Files& files, const UnfinishedOrder& order) {
-    if (!state.Careful || order.state.phase != OrderState::Phase::Prepared)
+    if (order.state.phase != OrderState::Phase::Prepared)
         return false;
+    if (order.state.held || !state.Careful)
+        return order.state.held;
     const std::optional<OrderLog> log = ReadOrderLog(files, order.folder);
     return log && !log->failed.isEmpty();
 }

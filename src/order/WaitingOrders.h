@@ -16,9 +16,9 @@ struct CountedOrder {
     bool byItself = true; // is sent by itself; else the staff sends it
 };
 
-// The orders whose sending can go on, oldest first, but for one that the staff has given up. One that waits for an
-// answer about pictures that were left out is not sent by itself; it is counted on a kiosk once it has lapsed. None
-// where another program runs in the data folder.
+// The orders whose sending can go on, oldest first, but for one that the staff has given up. One that its customer has
+// stopped, or that waits for an answer about pictures that were left out, is not sent by itself; it is counted on a
+// kiosk once it has lapsed. None where another program runs in the data folder.
 QList<CountedOrder> OrdersThatWait(const SessionState& state, const Platform& platform);
 
 // Which of the orders that wait is sent next, and when. Each pauses by the count of its tries, which its state keeps;

@@ -3,6 +3,7 @@
 #include "common/DrivePath.h"
 #include "common/Result.h"
 
+#include <QByteArray>
 #include <QDateTime>
 #include <QString>
 
@@ -40,6 +41,15 @@ public:
     virtual void copyToClipboard(const QString& text) = 0;
     // Also what was marked and never copied.
     virtual void clearClipboard() = 0;
+};
+
+class Printer {
+public:
+    virtual ~Printer() = default;
+    // Hands the pages to a print queue of the machine. Returns at once; done is called later, and tells whether the
+    // queue has taken them.
+    using Done = std::function<void(const Result<void>&)>;
+    virtual void print(const QString& queue, const QByteArray& pdf, Done done) = 0;
 };
 
 class Volume {

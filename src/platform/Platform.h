@@ -12,6 +12,7 @@ class Files;
 class Instances;
 class Internet;
 class Mail;
+class Printer;
 class Shell;
 class Volume;
 
@@ -27,6 +28,7 @@ struct Platform {
     const Volume& volume;
     const Instances& instances;
     Cards& cards;
+    Printer& printer;
     HostPath doorProgram; // lumora-door, which decodes what is no ordinary JPEG; where it is missing nothing is decoded
 };
 

@@ -46,6 +46,8 @@ public:
     virtual void setTexts() {}
     // Works by itself, and is not to be cut when nobody is there.
     virtual bool isWorking() const { return false; }
+    // The customer has come to an end here: a kiosk goes back without asking.
+    virtual bool isAtRest() const { return false; }
     // Nothing on it comes of a customer.
     virtual bool isUntouched() const { return false; }
     // Nobody is there any more, and the page will be taken away.

@@ -267,6 +267,7 @@ struct SessionState {
     bool Waiting = false;     // orders that did not arrive are sent by themselves while nobody is at the start page
     ScreenKeys screenKeys = ScreenKeys::Never;
     int waitingOrders = 0; // how many there are, as the start page counted them last
+    QString slipTrouble;   // why the last slip was not printed, in the machine's words; for the staff
     KioskRules kiosk;
     bool staff = false; // on a kiosk: the staff has given its code
 

@@ -54,7 +54,7 @@ struct hatchalaControls : Controls {
     Caption Label4Sfarot{*this, u"Label4Sfarot", Caption::At::Hidden}; // on a kiosk: the digits typed so far
     ControlArray<Caption, 10> Command4Sifra{*this, u"Command4Sifra", Caption::At::Hidden}; // the digits
     Caption Command4Mehak{*this, u"Command4Mehak", Caption::At::Hidden};                   // takes one back
-    Caption Label4Mamtinot{*this, u"Label4Mamtinot", Caption::At::Hidden}; // for the staff: how many orders wait
+    Caption Label4Mamtinot{*this, u"Label4Mamtinot", Caption::At::Hidden}; // for the staff: what waits for them
     DrivePath Picture4; // the file of the advertising picture; empty when there is none
 
     // Never shown: two buttons that code presses, and the service panel with the settings as one line of text.

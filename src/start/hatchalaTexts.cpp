@@ -99,7 +99,7 @@ void hatchala::showDigits() {
                     {Command4Achar, u"זו לא ההזמנה שלי", u"It is not my order"},
                     {Label4Hemshech, u"זו ההזמנה שלכם? נא להקיש את שלוש הספרות האחרונות של מספר הטלפון שבהזמנה.",
                      u"Is it yours? Type the last three digits of the telephone number of the order."},
-                    {Label4Od, u"הספרות אינן מתאימות. נסו שוב.", u"These digits do not match. Please try again."},
+                    {Label4Od, u"הספרות אינן מתאימות. נא לנסות שוב.", u"These digits do not match. Please try again."},
                     {Command4Mehak, u"", u"", u"מחק ספרה", u"Take back a digit"},
                 });
     Label4Od.visible = m_wrongDigits > 0 && m_digits.isEmpty();
@@ -144,10 +144,16 @@ QString hatchala::offerText(const UnfinishedOrder& order) const {
 
 void hatchala::showWaiting() {
     const int count = m_state.waitingOrders;
-    Label4Mamtinot.visible = count > 0;
-    Label4Mamtinot.text = count == 1
-                              ? m_state.wording(u"הזמנה אחת ממתינה לשליחה", u"1 order waits to be sent")
-                              : m_state.wording(u"%1 הזמנות ממתינות לשליחה", u"%1 orders wait to be sent").arg(count);
+    QStringList notes;
+    if (count == 1)
+        notes += m_state.wording(u"הזמנה אחת ממתינה לשליחה", u"1 order waits to be sent");
+    else if (count > 1)
+        notes += m_state.wording(u"%1 הזמנות ממתינות לשליחה", u"%1 orders wait to be sent").arg(count);
+    if (!m_state.slipTrouble.isEmpty())
+        notes += m_state.wording(u"מדפסת הפתקים אינה מדפיסה", u"the printer of the slips does not print");
+    Label4Mamtinot.visible = !notes.isEmpty();
+    Label4Mamtinot.text = notes.join(u" · "_s);
+    Label4Mamtinot.hint = m_state.slipTrouble;
 }
 
 bool hatchala::asksToThrowAway(const QString& number) {

@@ -45,7 +45,8 @@ class WorkingPage : public Page {
 public:
     using Page::Page;
     bool isWorking() const override { return works; }
-    inline static bool works;
+    bool isAtRest() const override { return rests; }
+    inline static bool works, rests;
 };
 
 class WaitingDialogs : public RecordedDialogs {
@@ -57,7 +58,7 @@ public:
 
 struct NobodyIsThere : ::testing::Test, PageRig {
     NobodyIsThere() {
-        WorkingPage::works = false;
+        WorkingPage::works = WorkingPage::rests = false;
         for (const PageId id : {PageId::kyoskNew, PageId::tFrmNew}) {
             chain.registerPage(id, [id] { return std::make_unique<WorkingPage>(id); });
             chain.show(id);
@@ -71,7 +72,7 @@ struct NobodyIsThere : ::testing::Test, PageRig {
 
     WaitingDialogs dialogs;
     Platform platform = machine.with(dialogs);
-    IdleEnd idle{{true, 90, {}, 30, 365}, platform, chain};
+    IdleEnd idle{{true, 90, {}, 30, 365, {}}, platform, chain};
 };
 
 TEST_F(NobodyIsThere, ButAnOrderThatIsPreparedOrSentIsNeverCut) {
@@ -83,6 +84,14 @@ TEST_F(NobodyIsThere, ButAnOrderThatIsPreparedOrSentIsNeverCut) {
     EXPECT_TRUE(idle.asks()) << "a page that waits for an answer does not work";
     wait(20s);
     EXPECT_FALSE(dialogs.waits || chain.hasEnded()) << "and goes on with a no";
+}
+
+TEST_F(NobodyIsThere, AndAPageOnWhichNothingIsLeftToDoGoesWithoutAQuestion) {
+    registerBare({PageId::hatchala});
+    WorkingPage::rests = true;
+    wait(90s);
+    EXPECT_FALSE(idle.asks());
+    EXPECT_EQ(chain.front()->id(), PageId::hatchala);
 }
 
 } // namespace

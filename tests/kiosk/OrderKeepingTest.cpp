@@ -12,7 +12,7 @@ using Phase = OrderState::Phase;
 struct KeptOrders : ::testing::Test, PageRig {
     KeptOrders() {
         state.Careful = true;
-        state.kiosk = {true, 90, {}, 10, 15};
+        state.kiosk = {true, 90, {}, 10, 15, {}};
     }
     static OrderState arrived(Phase phase = Phase::Reported, bool proven = true) {
         OrderState order;

@@ -165,6 +165,9 @@ TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
     nobodyCame.lapsed = true;
     const OrderFolder lapsed = give(u"2026_11_21_KUP_1234^100"_s, nobodyCame, {print});
     giveLog(lapsed, {}, {u"C:\\pics\\gone.jpg"_s});
+    OrderState held = inPhase(Phase::Prepared);
+    held.held = true;
+    const OrderFolder stopped = give(u"2026_11_21_KUP_1234^105"_s, held, {print});
     const auto waiting = [this](bool on, bool careful, bool kiosk) {
         session.Waiting = on;
         session.Careful = careful;
@@ -179,7 +182,10 @@ TEST_F(OrdersOfAKiosk, WaitOldestFirstAndPauseLongerBehindEachTry) {
     EXPECT_EQ(waiting(true, true, false), "102 ") << "the customer is to answer about the pictures left out";
     EXPECT_EQ(waiting(false, true, true), "100? ") << "on a kiosk nobody but the staff would know";
     EXPECT_EQ(waiting(true, true, true), "100? 102 ");
+    EXPECT_TRUE(OrderJournal(test.files, stopped).lapsed());
+    EXPECT_EQ(waiting(true, false, true), "100 101 102 105? ") << "its customer has stopped it";
 
+    waiting(true, true, true);
     using std::chrono::minutes;
     std::optional<WaitingOrders> rule(std::in_place, session, test.platform);
     rule->refresh();

@@ -98,8 +98,8 @@ protected:
         return std::make_unique<MediaFolders>(std::vector{toHostPath(media.path())},
                                               [](const HostPath& path) { return path.extension() == ".card"; });
     }};
-    Platform platform{machine.files, machine.dialogs, machine.noInternet, machine.mail, machine.shell, machine.clock,
-                      machine.pump,  machine.volume,  machine.instances,  cards,        LUMORA_DOOR};
+    Platform platform{machine.files, machine.dialogs, machine.noInternet, machine.mail, machine.shell,   machine.clock,
+                      machine.pump,  machine.volume,  machine.instances,  cards,        machine.printer, LUMORA_DOOR};
 };
 
 enum class At { Listed, Copying, HalfCopied, Finish, Copied, Editor, Compression, Preparing, TakenUp };

@@ -40,7 +40,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
               "[Operator]\nArea = no\nEditor = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting = yes\nKeyboard = Auto\n"
-              "Mode = yes\nIdleSeconds = 3600\nKeepDays = 7\nKeepLogDays = 9999\n[Log]\nKeep = yes\n"
+              "Mode = yes\nIdleSeconds = 3600\nKeepDays = 7\nKeepLogDays = 9999\nPrinter = slips\n[Log]\nKeep = yes\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
               "[Drives]\nProgramLetter = e\nDataFolder = /srv/lumora\nOrder = zd\n");
@@ -61,7 +61,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
                 lab.SplitPage && lab.FitMuzag && lab.DoarReshut && lab.TachanaMekomit && !lab.OperatorArea &&
                 lab.OperatorEditor && lab.KeepLog && state.screenKeys == ScreenKeys::Touches);
     EXPECT_TRUE(lab.GvulMuzag == 0 && lab.TmunatPaar == 1 && profile.ReportOn == 0 && lab.MediniyutDchisa == 1);
-    EXPECT_TRUE(state.kiosk == (KioskRules{true, 3600, {}, 7, 9999}));
+    EXPECT_TRUE(state.kiosk == (KioskRules{true, 3600, {}, 7, 9999, u"slips"_s}));
     const MailAccount& mail = lab.profile.mail;
     EXPECT_EQ(QStringList({mail.host, mail.user, mail.password, mail.from, mail.to}),
               QStringList({"mail.lab.example", "a@b", "x^y", "kiosk@lab.example", "o'neil+orders@lab.example"}));
@@ -148,7 +148,7 @@ TEST(LabFileTest, TheExampleSaysWhatTheDefaultsAre) {
     ASSERT_TRUE(example.errors.isEmpty()) << example.errors.join(u'\n').toStdString();
     // The keys whose example is not the built-in value.
     Deployment expected;
-    expected.Careful = expected.Waiting = expected.keptFtpSession = expected.watchedCards = true;
+    expected.Careful = expected.Waiting = expected.keptFtpSession = expected.watchedCards = expected.KeepLog = true;
     expected.ftpLines = 3;
     expected.door = {true, true, true};
     expected.OperatorArea = false;

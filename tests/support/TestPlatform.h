@@ -131,6 +131,16 @@ public:
     QList<MailOutcome> outcomes;  // of the next messages, in order; after them all succeed
 };
 
+class RecordedPrinter : public Printer {
+public:
+    void print(const QString& queue, const QByteArray& pdf, Done done) override {
+        papers += {queue, pdf};
+        whenDone = std::move(done);
+    }
+    QList<std::pair<QString, QByteArray>> papers;
+    Done whenDone; // of the last one
+};
+
 // The drives C: (in a temporary folder) and Z: with everything that a page asks for.
 class TestPlatform {
 public:
@@ -141,11 +151,11 @@ public:
         : drives(made("drive_c"), u'C', {made("media")})
         , files(drives)
         , instances(drives.dataFolder())
-        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, cards, {}} {}
+        , platform{files, dialogs, internet, mail, shell, clock, pump, volume, instances, cards, printer, {}} {}
 
     // The platform with another part in the place of its own.
     Platform with(Dialogs& other, Cards& media, Internet& line) {
-        return {files, other, line, mail, shell, clock, pump, volume, instances, media, {}};
+        return {files, other, line, mail, shell, clock, pump, volume, instances, media, printer, {}};
     }
     Platform with(Dialogs& other) { return with(other, cards, noInternet); }
     Platform with(Cards& media) { return with(dialogs, media, noInternet); }
@@ -162,6 +172,7 @@ public:
     NoInternet noInternet;
     RecordedMail mail;
     Cards cards;
+    RecordedPrinter printer;
     Platform platform;
 
 private:

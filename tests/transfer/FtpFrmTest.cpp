@@ -1,5 +1,6 @@
 #include "imaging/files/PictureFile.h"
 #include "order/OrderFolder.h"
+#include "order/OrderJournal.h"
 #include "order/OrderLog.h"
 #include "order/OrderState.h"
 #include "order/PrintFile.h"
@@ -8,6 +9,7 @@
 #include "session/Workspace.h"
 #include "support/FtpFrmRig.h"
 #include "transfer/delivery/OrderFiles.h"
+#include "transfer/slip/OrderSlip.h"
 
 #include <QTest>
 
@@ -231,12 +233,40 @@ TEST(FtpFrm, LeadsBackToThePicturesUntilTheSendingBegins) {
     }
 }
 
+TEST(FtpFrm, PrintsASlipAndTellsTheCustomerOnceTheQueueHasIt) {
+    for (const bool takes : {true, false}) {
+        Line line;
+        SessionState& state = line.rig.state;
+        RecordedPrinter& printer = line.rig.test.printer;
+        state.kiosk.printer = u"slips"_s;
+        FtpFrm& page = line.rig.start();
+        const SendingPage& shown = page;
+        page.showPrints();
+        EXPECT_TRUE(shown.slipCode().isNull());
+        page.Image5_Click();
+        ASSERT_EQ(printer.papers.size(), 1);
+        EXPECT_EQ(printer.papers[0].first, u"slips");
+        EXPECT_TRUE(printer.papers[0].second.startsWith("%PDF"));
+        EXPECT_FALSE(page.controls().slip.visible || shown.slipCode().isNull());
+        printer.whenDone(takes ? Result<void>() : Failure{Failure::Kind::Refused, u"no such queue"_s});
+        EXPECT_EQ(page.controls().slip.visible, takes);
+        EXPECT_EQ(state.slipTrouble, takes ? u""_s : u"no such queue"_s);
+        EXPECT_EQ(OrderSlip::codeOf(state), FtpFrmRig::name() + u"\n13\n03-1234567"_s) << "no name";
+        line.rig.chain.unload(PageId::FtpFrm);
+        printer.whenDone({});
+    }
+}
+
 TEST_F(FtpFrmTest, SendsAfterTheFifteenthSecondAndOnlyOnce) {
+    EXPECT_TRUE(OrderJournal(rig.test.files, OrderFolder(FtpFrmRig::folder())).prepared());
+    const auto isHeld = [this] { return take(ReadOrderState(rig.test.files, OrderFolder(FtpFrmRig::folder()))).held; };
     FtpFrm& page = rig.start();
     page.Command23_Click();
     EXPECT_FALSE(page.counting());
+    EXPECT_TRUE(isHeld()) << "it is not sent by itself";
     page.Command23_Click();
     EXPECT_TRUE(page.counting());
+    EXPECT_FALSE(isHeld());
     for (int tick = 0; tick < 14; ++tick)
         page.Timer1_Tick();
     EXPECT_EQ(page.controls().Label20.text, u"1"_s);

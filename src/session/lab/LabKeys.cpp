@@ -265,6 +265,10 @@ std::vector<Row> rows() {
         {"Kiosk", "Code",
          text(at(&KioskRules::code), u"what \"lumora --kiosk-code\" prints, or empty"_s,
               u"([0-9]{5,7}:[0-9a-f]{32}:[0-9a-f]{64})?"_s)},
+        {"Kiosk", "Printer",
+         text(at(&KioskRules::printer),
+              u"the name of a print queue, up to 127 characters without / # and blanks, or empty"_s,
+              u"([^\\s/#-][^\\s/#]{0,126})?"_s)},
         {"Kiosk", "KeepDays", number(at(&KioskRules::keepDays), 1, 9999)},
         {"Kiosk", "KeepLogDays", number(at(&KioskRules::keepLogDays), 1, 9999)},
 

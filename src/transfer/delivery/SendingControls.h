@@ -30,6 +30,8 @@ struct SendingControls : Controls {
     Caption thanks{*this, u"thanks", Caption::At::Hidden};
     Caption shortNumber{*this, u"shortNumber"};
     Caption nextSteps{*this, u"nextSteps", Caption::At::Hidden}; // what becomes of the order now
+    Caption slip{*this, u"slip", Caption::At::Hidden};           // the queue has taken it
+    Caption slipCode{*this, u"slipCode", Caption::At::Hidden};   // a picture of it: what the staff scans
     Caption cardMayGo{*this, u"cardMayGo", Caption::At::Hidden}; // a card is in, and nothing reads it any more
 
     LeftOutControls leftOut{*this};

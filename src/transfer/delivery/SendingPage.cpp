@@ -1,6 +1,8 @@
 #include "transfer/delivery/SendingPage.h"
 
 #include "common/StationLog.h"
+#include "common/Warning.h"
+#include "imaging/drawing/QrCode.h"
 #include "order/CompletenessGuard.h"
 #include "order/KeptWork.h"
 #include "order/LeftOutPictures.h"
@@ -19,7 +21,9 @@
 #include "transfer/delivery/SendingTexts.h"
 #include "transfer/report/LabReport.h"
 #include "transfer/report/ReportOnce.h"
+#include "transfer/slip/OrderSlip.h"
 
+#include <QPointer>
 #include <QTimer>
 
 #include <algorithm>
@@ -211,6 +215,7 @@ void SendingPage::enter(SendingPhase phase) {
     readPrints();
     watchCards();
     tellPhase();
+    printSlip();
     Q_EMIT changed();
 }
 
@@ -269,7 +274,40 @@ void SendingPage::showThanks() {
     m_shown.shortNumber.text = ShortNumber(OrderFolder::chosen(m_state).name());
     m_shown.nextSteps.visible = thanked && printsNext;
     m_shown.nextSteps.text = wording(nextStepsWords);
+    m_shown.slip.visible = thanked && m_slipTaken;
+    m_shown.slip.text = wording(slipTakenWords);
+    m_shown.slipCode.visible = thanked && knowsCustomer() && (m_state.kiosk.on || !m_state.kiosk.printer.isEmpty());
+    m_shown.slipCode.text = wording(slipCodeWords);
     showCardMayGo();
+}
+
+Bitmap SendingPage::slipCode() const {
+    return m_shown.slipCode.visible ? qrCode(OrderSlip::codeOf(m_state), 1) : Bitmap();
+}
+
+// For a customer who stands before the page, once. What becomes of it is told to the staff, who see the start page.
+void SendingPage::printSlip() {
+    const QString queue = m_state.kiosk.printer;
+    if (m_slipAsked || !m_isLookedAt || !isThanked(m_phase) || queue.isEmpty() ||
+        m_state.transfer.SugMishloah != Sending::NewOrder)
+        return;
+    m_slipAsked = true;
+    m_platform.printer.print(
+        queue, OrderSlip(m_state).pdf(),
+        [page = QPointer(this), queue, &state = m_state, &chain = m_chain](const Result<void>& done) {
+            state.slipTrouble = done ? QString() : done.failure().message;
+            if (!done)
+                writeWarning(u"the slip can't be printed on \"%1\": %2"_s.arg(queue, done.failure().message));
+            if (page)
+                page->slipHandedOver(done.ok());
+            chain.setAllTexts();
+        });
+}
+
+void SendingPage::slipHandedOver(bool taken) {
+    m_slipTaken = taken;
+    showThanks();
+    Q_EMIT changed();
 }
 
 void SendingPage::watchCards() {
@@ -346,7 +384,7 @@ BothLanguages SendingPage::inBoth(const std::function<QString(const SessionState
 }
 
 bool SendingPage::isAtRest() const {
-    return look().buttons.testFlag(SendingButton::NewOrder) && !lineInUse();
+    return look().buttons.testFlag(SendingButton::NewOrder) && m_phase != SendingPhase::Waiting && !lineInUse();
 }
 
 void SendingPage::forgetReason() {
@@ -391,6 +429,13 @@ void SendingPage::reportAgain() {
 
 void SendingPage::watchReport() {
     report().watch();
+}
+
+void SendingPage::keepHeld(bool held) const {
+    OrderJournal order(m_platform.files, OrderFolder::chosen(m_state));
+    const bool waits = order.known() && order.state().phase == OrderState::Phase::Prepared;
+    if (waits && m_state.transfer.SugMishloah == Sending::NewOrder && !order.held(held))
+        tellNotKept();
 }
 
 void SendingPage::tellNotKept() const {

@@ -58,7 +58,7 @@ public:
     BothLanguages whyItEnded() const;
     // Nothing is left to do but to begin a new order, or to send again. Then the page may be left where nobody is
     // there.
-    bool isAtRest() const;
+    bool isAtRest() const override;
     void leaveUnattended() { leaveForNewOrder(); }
 
     // As SmallLeftOut().
@@ -66,6 +66,9 @@ public:
     // The first prints of the order. They are read only where somebody looks at the page.
     void showPrints();
     const std::vector<Bitmap>& prints() const { return m_previews.pictures(); }
+
+    // What slipCode shows: black modules of one pixel on white. Null where it is hidden.
+    Bitmap slipCode() const;
 
     // What the operator's area shows of the order. A telling that was begun may have been heard or not.
     bool reportUnknown() const;
@@ -107,6 +110,8 @@ protected:
     void forgetReason();
     // A step of the sending could not be kept in the order's folder.
     void tellNotKept() const;
+    // The customer has stopped the count, or lets it go on: what is stopped is not sent by itself.
+    void keepHeld(bool held) const;
     // Asked of the files that make up the chosen order; a question's loop may close the page.
     bool mayBeSent(const QStringList& paths);
     // The order's number is another order's on the server: follows the way to the page that prepares the order again
@@ -137,6 +142,8 @@ private:
     bool knowsCustomer() const;
     void showFacts();
     void showThanks();
+    void printSlip();
+    void slipHandedOver(bool taken);
     void watchCards();
     void showCardMayGo();
     void readPrints();
@@ -160,6 +167,8 @@ private:
     Ticker Timer4Report; // 1000 ms: the watch over a telling
     PrintPreviews m_previews;
     bool m_isLookedAt = false;               // somebody looks at the page
+    bool m_slipAsked = false;                // it was handed over for printing
+    bool m_slipTaken = false;                // the queue has it
     bool m_wayBack = true;                   // nothing of the order was sent
     std::optional<Cards::Watch> m_cardWatch; // of an order that has arrived
     SendingPhase m_phase = SendingPhase::Preparing;

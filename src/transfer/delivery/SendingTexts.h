@@ -39,6 +39,11 @@ inline constexpr SendingWords kioskSendingAdvice{u"ההזמנה נשלחת. נא
 inline constexpr SendingWords kioskRefusedAdvice{
     u"לא נשלח דבר. ההזמנה שמורה במחשב זה. יש לפנות לצוות החנות.",
     u"Nothing was sent. The order is kept on this computer. Please tell the staff of the shop."};
+// %1: files on the server, %2: files of the order.
+inline constexpr SendingWords kioskPartThereAdvice{
+    u"כל %2 הקבצים שנבחרו נמצאים בשרת, ובתיקייה שם %1 קבצים, אך ההזמנה אינה שלמה שם. יש לפנות לצוות החנות.",
+    u"All %2 chosen files are on the server, whose folder holds %1, but the order is not whole there. Please tell the "
+    u"staff of the shop."};
 inline constexpr SendingWords kioskSentAdvice{u"כל ההזמנה הגיעה. אפשר להתחיל הזמנה חדשה.",
                                               u"The whole order has arrived. You can begin a new order."};
 inline constexpr SendingWords kioskPartSentAdvice{u"מה שבהזמנה הגיע. אפשר להתחיל הזמנה חדשה.",
@@ -57,6 +62,13 @@ inline constexpr SendingWords nextStepsWords{u"עכשיו המעבדה מדפי�
 // %1: the lab's telephone.
 inline constexpr SendingWords forQuestionsWords{u" לשאלות, לאיסוף ולתשלום: %1",
                                                 u" For questions, collecting and payment: %1"};
+inline constexpr SendingWords slipNumberWords{u"מספר ההזמנה", u"Order number"};
+inline constexpr SendingWords slipPrintsWords{u"תמונות", u"Prints"};
+inline constexpr SendingWords slipTelephoneWords{u"טלפון", u"Telephone"};
+inline constexpr SendingWords slipTakenWords{u"הפתק שלכם מודפס. נא לקחת אותו.",
+                                             u"Your slip is being printed. Please take it."};
+inline constexpr SendingWords slipCodeWords{u"קוד של ההזמנה, לסריקה בחנות",
+                                            u"A code of the order, to scan in the shop"};
 inline constexpr SendingWords cardMayGoWords{u"אפשר להוציא עכשיו את הכרטיס.", u"You can take your card out now."};
 
 inline constexpr SendingWords goesOnByItselfAdvice{

@@ -123,14 +123,17 @@ void FtpFrm::holdCount() {
     if (!Timer1.running())
         return;
     Timer1.stop();
+    keepHeld(true);
     enter(SendingPhase::Waiting);
 }
 
 void FtpFrm::holdOrGoOn() {
     if (Timer1.running())
         holdCount();
-    else if (canSend() && !lists().List4Makor.isEmpty())
+    else if (canSend() && !lists().List4Makor.isEmpty()) {
+        keepHeld(false);
         startCount();
+    }
 }
 
 void FtpFrm::sendNow() {
@@ -309,7 +312,7 @@ void FtpFrm::showProof() {
     if (!m_proofWanted || m_proofText.isEmpty())
         return;
     Picture13.visible = true;
-    Picture13File = WorkspacePaths::root(m_state) / u"001.jpg";
+    Picture13File = WorkspacePaths::summaryPicture(m_state);
     Q_EMIT changed();
 }
 

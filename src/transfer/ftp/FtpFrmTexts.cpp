@@ -104,7 +104,8 @@ QString FtpFrm::advice(const PhaseLook& row) const {
             u"להודיע לחנות.",
             u"The server did not tell what has arrived. Press Send again to check and send once more. If "
             u"this comes again, please tell the shop.");
-    const QString text = SendingPage::advice(row);
+    const bool isStaffs = row.phase == SendingPhase::PartThere && !mayBeClosed(); // so are the finished orders
+    const QString text = isStaffs ? wording(kioskPartThereAdvice) : SendingPage::advice(row);
     return text.contains(u'%') ? text.arg(m_sender.check.NumOnServer).arg(m_sender.NumToSend) : text;
 }
 

@@ -173,6 +173,7 @@ void UploadForm::stopCount() {
     if (!idle() || phase() != SendingPhase::Countdown)
         return;
     stopTimers();
+    keepHeld(true);
     enter(SendingPhase::Waiting);
 }
 
@@ -182,9 +183,10 @@ void UploadForm::endCount() {
 }
 
 void UploadForm::goOn() {
-    if (idle() && phase() == SendingPhase::Waiting)
+    if (idle() && phase() == SendingPhase::Waiting) {
+        keepHeld(false);
         startPanel();
-    else if (phase() == SendingPhase::Stopped)
+    } else if (phase() == SendingPhase::Stopped)
         refreshList(); // the server is asked for what has arrived until the stop
 }
 

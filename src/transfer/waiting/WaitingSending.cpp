@@ -35,9 +35,9 @@ WaitingSending::WaitingSending(SessionState& state, const Platform& platform, Pa
     : m_state(state)
     , m_deployment(deployment)
     , m_chain(chain)
-    , m_platform{platform.files,     m_dialogs,      platform.internet,   platform.mail,
-                 platform.shell,     platform.clock, platform.pump,       platform.volume,
-                 platform.instances, platform.cards, platform.doorProgram}
+    , m_platform{platform.files,     m_dialogs,      platform.internet, platform.mail,
+                 platform.shell,     platform.clock, platform.pump,     platform.volume,
+                 platform.instances, platform.cards, platform.printer,  platform.doorProgram}
     , m_pages(platform.pump)
     , m_orders(state, m_platform)
     , m_timer(waitingTick, [this] { step(); }) {

@@ -5,6 +5,7 @@
 #include "views/kit/Overlay.h"
 #include "views/kit/PrintFan.h"
 
+#include <QLabel>
 #include <QListWidget>
 #include <QProgressBar>
 #include <QScrollArea>
@@ -14,6 +15,12 @@
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int codeSide = 130; // in the page's terms, with its empty edge
+
+} // namespace
 
 SendingView::SendingView(SendingPage& page, const SessionState& state, const Theme& theme)
     : LeftOutView(
@@ -35,16 +42,22 @@ void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_lis
     const Card card = makeSignedCard("success", u"tick"_s, Theme::Colour::Good);
     add(*card.column, {label(shown.cardMayGo, "strong")});
     follow(card.frame, shown.cardMayGo);
-    add(*progress, {centred(label(shown.nextSteps)), card.frame, Item::room(), makeLeftOutCard()});
+    add(*progress, {centred(label(shown.nextSteps)), centred(label(shown.slip, "strong")), card.frame, Item::room(),
+                    makeLeftOutCard()});
     add(*progress, troubles);
     frame().content()->addLayout(inRow(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}), 1);
 }
 
 void SendingView::makeThanks(const Caption& prompt, const Caption& whole) {
     const SendingControls& shown = m_page.sendingControls();
-    m_thanks = inBox(
-        inColumn(Space::None, {centred(label(shown.thanks, "display")), Space::Normal, centred(label(prompt, "muted")),
-                               centred(label(shown.shortNumber, "giant")), centred(orderName(whole, "smallMuted"))}));
+    m_code = new QLabel(this);
+    bind(m_code, shown.slipCode);
+    m_thanks = inBox(inColumn(Space::None, {centred(label(shown.thanks, "display")),
+                                            Space::Normal,
+                                            centred(label(prompt, "muted")),
+                                            centred(label(shown.shortNumber, "giant")),
+                                            centred(orderName(whole, "smallMuted")),
+                                            {m_code, 0, Qt::AlignHCenter}}));
     follow(m_thanks, shown.thanks);
 }
 
@@ -144,6 +157,7 @@ void SendingView::render() {
     frame().setTitle(shown.Label4Title.text);
     renderGauge();
     renderPrints();
+    renderCode();
     for (const auto& [heading, list] : m_headed)
         speak(list, heading->text);
     changeRole(m_mainActions.at(SendingButton::NewOrder), look.main == SendingButton::NewOrder ? "main" : "secondary");
@@ -164,6 +178,15 @@ void SendingView::renderPrints() {
     m_fan->setPrints(std::move(prints));
     m_fan->setVisible(hasOrder(m_page.phase()));
     m_fan->setAccessibleName(wording(u"התמונות הראשונות בהזמנה"_s, u"The first pictures of the order"_s));
+}
+
+// Whole pixels for each module, so that a camera reads it.
+void SendingView::renderCode() {
+    const QImage code = m_page.slipCode().image();
+    if (code.isNull())
+        return;
+    const int side = code.width() * std::max(theme().px(codeSide) / code.width(), 2);
+    m_code->setPixmap(QPixmap::fromImage(code.scaled(side, side)));
 }
 
 void SendingView::renderGauge() {

@@ -52,11 +52,13 @@ protected:
 private:
     void renderGauge();
     void renderPrints();
+    void renderCode();
 
     SendingPage& m_page;
     Gauge* m_gauge;
     QWidget* m_thanks = nullptr;
     PrintFan* m_fan;
+    QLabel* m_code = nullptr;
     std::map<SendingButton, QPushButton*> m_mainActions;
     std::vector<std::pair<const Caption*, QListWidget*>> m_headed;
     QWidget* m_main = nullptr; // what had the keyboard last
