@@ -196,8 +196,11 @@ def three_wait(case):
     """Three orders whose server is down; it comes back, and the program that sends them by itself is killed in a file of the second."""
     case.switches = '[Kiosk]\nWaiting = yes\n[Switches]\n'
     told = [case.play(case.order_of, case.way) and 'you need not wait' in case.mine.said for _ in range(3)]
-    case.acts['STOR'] = Act(lambda session, line: session.forward(
-        line, change=lambda content: case.mine.kill() or content[:len(content) // 2]), 1, IN_THE_SECOND)
+    if case.way == 'ftp':
+        case.acts['STOR'] = Act(lambda session, line: session.forward(
+            line, change=lambda content: case.mine.kill() or content[:len(content) // 2]), 1, IN_THE_SECOND)
+    else:
+        case.acts['POST'] = Act(stored_and_cut(half, kills=True), 1, IN_THE_SECOND_BY_HTTP)
     case.play('waiting', healed=True)
     killed = case.mine.status == -9
     case.heal()
@@ -205,12 +208,12 @@ def three_wait(case):
     here = [(order.name, name, content) for order in case.mine.orders() for name, content in case.mine.files(order).items() if name != '000.jpg']
     there = all((case.arrived / order / name).is_file() and (case.arrived / order / name).read_bytes() == content for order, name, content in here)
     case.result = 'arrived whole' if len(here) == 15 and there else 'LIE: files missing or damaged'
-    twice = sum(already for _, already in case.relay.puts)
+    twice = sum(already for _, already in (case.relay or case.web).puts)
     case.found = [text for text, is_so in (('the customer is not told', not all(told)), ('not killed', not killed), ('still waiting', case.mine.status != 0),
                                            (f'{twice} sent twice', twice > 0)) if is_so] + case.wrong_reports(3)
 
 
-IN_THE_SECOND = 9    # of the puts; an order has six
+IN_THE_SECOND, IN_THE_SECOND_BY_HTTP = 9, 7    # of the puts; an order has six, by HTTP five
 
 # The third put is a print. Of a pair the first number is that with a session for each file, the second that with a session kept.
 PRINT = 3
@@ -429,6 +432,7 @@ FIRST = 2
 HTTP = [
     Fault('no fault', quick=True),
     Fault('nobody listens', host='closed'),
+    Fault('nobody listens to three orders, then killed', host='closed', plays=three_wait, quick=True),
     Fault('a black hole', host='blackhole', clock=60),
     Fault('half of a file stored, once', {'POST': (stored(half), 1, 2)}, quick=True),
     Fault('half of a file stored, always', {'POST': (stored(half), ALWAYS, 2)}),
