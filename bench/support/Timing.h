@@ -14,19 +14,21 @@ struct Times {
     double thread = 0;    // processor time of the calling thread alone
 };
 
+// Since unknown moments.
+inline Times timeNow() {
+    const auto wall = std::chrono::steady_clock::now().time_since_epoch();
+    timespec thread{};
+    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &thread);
+    return {std::chrono::duration<double, std::milli>(wall).count(),
+            1000.0 * static_cast<double>(std::clock()) / CLOCKS_PER_SEC,
+            static_cast<double>(thread.tv_sec) * 1e3 + static_cast<double>(thread.tv_nsec) / 1e6};
+}
+
 template <class Work>
 Times timed(Work work) {
-    const auto now = [] {
-        const auto wall = std::chrono::steady_clock::now().time_since_epoch();
-        timespec thread{};
-        clock_gettime(CLOCK_THREAD_CPUTIME_ID, &thread);
-        return Times{std::chrono::duration<double, std::milli>(wall).count(),
-                     1000.0 * static_cast<double>(std::clock()) / CLOCKS_PER_SEC,
-                     static_cast<double>(thread.tv_sec) * 1e3 + static_cast<double>(thread.tv_nsec) / 1e6};
-    };
-    const Times before = now();
+    const Times before = timeNow();
     work();
-    const Times after = now();
+    const Times after = timeNow();
     return {after.wall - before.wall, after.processor - before.processor, after.thread - before.thread};
 }
 
