@@ -364,7 +364,7 @@ FAULTS = {
         F('album.SoogLBM == notChosen', 'false', 'an album without a kind is ordered'),
         F('state.shemot.maat = u"M"_s;', 'state.shemot.maat = u"G"_s;', 'albums are on another paper'),
         F('extra.clear();', '', 'the prompt of a list is ordered as an extra')],
-    'src/entry/album/AlbumChoices.cpp': [F('list.items.value(row, list.prompt)', 'list.items.value(row)', 'an untouched list passes for a choice')],
+    'src/order/AlbumChoicesTexts.cpp': [F('list.items.value(row, list.prompt)', 'list.items.value(row)', 'an untouched list passes for a choice')],
     'src/entry/details/DetailsCheck.cpp': [
         F('shemot.n2 = telephone.trimmed();', 'shemot.n2 = telephone;', 'blanks take the columns of the telephone'),
         F('shemot.n2.isEmpty()', 'false', 'an order has no telephone'),

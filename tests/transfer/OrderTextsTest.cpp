@@ -47,8 +47,10 @@ TEST(OrderFacts, AreInWordsAndLeaveOutWhatIsNotKnown) {
              s.shemot.n1.clear();
              s.album.ShemZalam = u"Studio Or"_s;
              s.album.SoogLBM = u"פוטו גדול"_s;
+             s.album.SoogNiar = u"בחר סוג נייר"_s; // none was
+             s.shemot.Hearot = QString(25, u'x');
          },
-         u"Studio Or|03-1234567|13|פוטו גדול|gift"_s},
+         u"Studio Or|03-1234567|13|Photo large|xxxxxxxxxxxxxxxxxxxxxxxx\u200Bx"_s},
     };
     for (const auto& each : cases) {
         SessionState state = exampleOrder();

@@ -1,8 +1,8 @@
 #include "entry/album/AlbumCheck.h"
 
 #include "common/FixedText.h"
-#include "entry/album/AlbumChoices.h"
 #include "entry/details/DetailsCheck.h"
+#include "order/AlbumChoices.h"
 #include "session/SessionState.h"
 
 namespace lumora {

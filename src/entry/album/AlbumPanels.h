@@ -1,8 +1,8 @@
 #pragma once
 
 #include "entry/album/AlbumCheck.h"
-#include "entry/album/AlbumChoices.h"
 #include "entry/album/AlbumControls.h"
+#include "order/AlbumChoices.h"
 #include "order/MailAddressGuard.h"
 #include "platform/Platform.h"
 #include "session/Ticker.h"

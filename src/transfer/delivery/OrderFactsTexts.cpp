@@ -1,6 +1,7 @@
 #include "transfer/delivery/OrderFacts.h"
 
 #include "common/PaperSize.h"
+#include "order/AlbumChoices.h"
 #include "order/ChoiceWords.h"
 #include "order/OrderNames.h"
 #include "session/SessionState.h"
@@ -54,9 +55,18 @@ QString paperText(const SessionState& state) {
                    paperWord(state, told(state.shemot.maat)), borderText(state), whole});
 }
 
+// The order carries the Hebrew item, or the Hebrew prompt where none was taken.
+QString albumWord(const SessionState& state, AlbumChoice choice, const QString& item) {
+    if (const int row = orderedRow(choice, item); row >= 0)
+        return albumItems(choice, state.english())[row].simplified();
+    return item == albumPrompt(choice, false) ? QString() : told(item);
+}
+
 QString albumText(const SessionState& state) {
     const AlbumDetails& album = state.album;
-    return joined({told(album.SoogLBM), told(album.GodelLBM), told(album.SoogKricha), told(album.SoogNiar)});
+    return joined(
+        {albumWord(state, AlbumChoice::Kind, album.SoogLBM), albumWord(state, AlbumChoice::Size, album.GodelLBM),
+         albumWord(state, AlbumChoice::Cover, album.SoogKricha), albumWord(state, AlbumChoice::Paper, album.SoogNiar)});
 }
 
 // The log of an order that is sent again does not tell it.
@@ -72,6 +82,22 @@ QString deliveryText(const SessionState& state) {
     if (state.KodMishloach == u"SOK"_s || state.KodMishloach == u"OSK"_s)
         return state.profile.Shops[state.KodMishloach == u"SOK"_s ? 0 : 1].name;
     return {};
+}
+
+// No line is cut where a word is longer than it.
+QString breakable(const QString& text) {
+    constexpr qsizetype longWord = 24;
+    QString result;
+    qsizetype letters = 0;
+    for (const QChar c : text) {
+        letters = c.isSpace() ? 0 : letters + 1;
+        if (letters > longWord) {
+            result += QChar(0x200B);
+            letters = 1;
+        }
+        result += c;
+    }
+    return result;
 }
 
 // The order keeps the branch behind the note, and the dash between them also without either.
@@ -98,6 +124,8 @@ QList<OrderFact> OrderFacts(const SessionState& state) {
         {state.wording(u"אלבום", u"Album"), state.Optint == OrderKind::Album ? albumText(state) : QString()},
         {state.wording(u"אופן הקבלה", u"Delivery"), deliveryText(state)},
         {state.wording(u"הערה", u"Note"), noteText(state)}};
+    for (OrderFact& fact : facts)
+        fact.text = breakable(fact.text);
     facts.removeIf([](const OrderFact& fact) { return fact.text.isEmpty(); });
     return facts;
 }

@@ -1,4 +1,4 @@
-#include "entry/album/AlbumChoices.h"
+#include "order/AlbumChoices.h"
 
 namespace lumora {
 
