@@ -46,7 +46,7 @@ using namespace Qt::StringLiterals;
 // Each member uses only those above it, as it is made.
 struct Program::Parts {
     Parts(Deployment read, const HostPath& dataFolder, Instances run, Internet* line, Cards::Source media,
-          DesktopShell::Opener opener)
+          DesktopShell::Opener opener, const Clock* time)
         : deployment(std::move(read))
         , drives(dataFolder, deployment.programLetter, Drives::defaultMediaRoots(), deployment.driveOrder)
         , files(drives)
@@ -57,6 +57,7 @@ struct Program::Parts {
                      writeWarning(u"the mark of the data folder can't be kept: %1"_s.arg(why.message));
                  })
         , cards(deployment.watchedCards ? std::move(media) : Cards::Source(), deployment.door.everyFormat)
+        , clock(time ? *time : systemClock)
         , internet({}, deployment.ftpType)
         , shell(drives, std::move(opener))
         , chain(pump)
@@ -100,7 +101,8 @@ struct Program::Parts {
     StatVolume fileSystem;
     MarkedVolume volume;
     Cards cards;
-    SystemClock clock;
+    SystemClock systemClock;
+    const Clock& clock;
     QtEventPump pump;
     PocoInternet internet;
     SmtpMail mail;
@@ -188,8 +190,9 @@ Result<void> Program::start() {
     if (!run.another())
         removeLeftovers(dataFolder, startTime);
 
-    m_parts = std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet,
-                                      m_options.media ? m_options.media : systemMedia, m_options.opener);
+    m_parts =
+        std::make_unique<Parts>(std::move(reading.deployment), dataFolder, std::move(run), m_options.internet,
+                                m_options.media ? m_options.media : systemMedia, m_options.opener, m_options.clock);
     Parts& parts = *m_parts;
     registerPages(parts.chain, parts.state, parts.platform, parts.deployment);
     QObject::connect(&parts.chain, &PageChain::shown, &parts.window, [&parts](const Page* page) {

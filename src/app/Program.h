@@ -12,6 +12,7 @@
 
 namespace lumora {
 
+class Clock;
 class Internet;
 class KeptLog;
 class MainWindow;
@@ -28,6 +29,7 @@ struct ProgramOptions {
     bool operatorArea = false;    // opens the hidden area of the sending page, whatever the deployment says
     DesktopShell::Opener opener;  // replaces the desktop's browser and file manager
     Internet* internet = nullptr; // replaces the machine's own line
+    const Clock* clock = nullptr; // replaces the machine's own
     Cards::Source media;          // replaces the machine's own media, where the lab has them watched
 };
 

@@ -25,6 +25,7 @@ SAMPLE = 3  # prints of an order that are held against the customer's picture, b
 SIDE, TILE = 150, 8  # pixels: of the small pictures that are compared, and of their tiles
 TOLERANCE = 5  # mean difference of preview and print, of 255; it is 1 to 2 where nothing is wrong
 TILE_TOLERANCE = 16  # the same of the tile that differs most; it is 13 at most
+COARSE = ('1024x768',)  # windows whose editor draws too small a paper for these
 
 
 def plain(text):
@@ -97,8 +98,9 @@ class Order:
 
 
 class Walk:
-    def __init__(self, record, data, lab, tools):
+    def __init__(self, record, data, lab, tools, size):
         self.record, self.data, self.lab, self.tools = record, data, lab, tools
+        self.fine = size not in COARSE
         self.orders = self.prints = self.previews = self.arrived = 0
         self.largest = self.worst = 0  # difference of a print and what was seen, and of a tile of it
         self.found = []
@@ -108,6 +110,8 @@ class Walk:
         order, promise, folder, kept = Order(), None, None, None
         for line in self.lines:
             page, shown = line.get('page'), line.get('shown', {})
+            if 'idled' in line:
+                order, promise, folder = Order(), None, None
             if 'front' in line:
                 if line['front'] == 'nnn' and line['before'] == 'kyoskNew':
                     order.before = order.choice, dict(order.details)
@@ -290,7 +294,7 @@ class Walk:
                 deep = field('More Comp = ') == '1'
                 faults = self.comparePrint(pathlib.Path(scratch), picture, path, record, paper, deep, folder.parent.parent / 'corrected')
                 seen = promise['previews'].get(self.leaf(path)) if edited else self.source(path)
-                if seen and not deep and (file in chosen or file in names[:SAMPLE]):
+                if seen and not deep and (self.fine or not edited) and (file in chosen or file in names[:SAMPLE]):
                     self.previews += edited
                     faults += self.compareSeen(pathlib.Path(scratch), picture, seen)
                 for fault in faults:

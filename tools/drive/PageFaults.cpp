@@ -31,9 +31,14 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-bool hasHebrew(const QString& text) {
-    return std::any_of(text.begin(), text.end(),
-                       [](QChar c) { return c.unicode() >= 0x0590 && c.unicode() <= 0x05FF; });
+// A part of one will do: names are cut where there is no room.
+bool hasHebrew(const QString& text, const QString& data = {}) {
+    static const QRegularExpression word(u"[\u0590-\u05FF]+"_s);
+    for (auto found = word.globalMatch(text); found.hasNext();) {
+        if (!data.contains(found.next().captured()))
+            return true;
+    }
+    return false;
 }
 
 QString nameOf(const QWidget& widget) {
@@ -172,6 +177,26 @@ bool cutsInk(QLabel& label) {
     return false;
 }
 
+// Of two controls that lie over one another a finger can't tell which it presses.
+QStringList overlaps(const QWidget& root) {
+    QStringList result;
+    QList<std::pair<const QWidget*, QRect>> seen;
+    for (const QWidget* control : root.findChildren<QWidget*>()) {
+        if (!control->isVisible() ||
+            !(qobject_cast<const QAbstractButton*>(control) || qobject_cast<const QLineEdit*>(control) ||
+              qobject_cast<const QComboBox*>(control)))
+            continue;
+        const QRect place =
+            control->visibleRegion().boundingRect().translated(control->mapTo(control->window(), QPoint()));
+        for (const auto& [other, where] : seen) {
+            if (where.intersects(place) && !other->isAncestorOf(control) && !control->isAncestorOf(other))
+                result += u"%1 lies over %2"_s.arg(nameOf(*control), nameOf(*other));
+        }
+        seen += {control, place};
+    }
+    return result;
+}
+
 QString clippedText(const QWidget& widget) {
     if ((qobject_cast<const QPushButton*>(&widget) || widget.inherits("QCheckBox")) &&
         widget.sizeHint().width() > widget.width() + 1)
@@ -181,7 +206,7 @@ QString clippedText(const QWidget& widget) {
 
 } // namespace
 
-QStringList pageFaults(Program& program) {
+QStringList pageFaults(Program& program, const QString& data) {
     const bool english = program.state().english();
     QStringList result;
     MainWindow& window = program.window();
@@ -227,6 +252,7 @@ QStringList pageFaults(Program& program) {
             }
         }
     }
+    result += overlaps(*root);
     for (QWidget* widget : root->findChildren<QWidget*>()) {
         if (!widget->isVisible() || widget->size().isEmpty())
             continue;
@@ -262,16 +288,16 @@ QStringList pageFaults(Program& program) {
         if (english && !widget->property("letterOfAnyLanguage").toBool()) {
             QString said = widget->accessibleName() + widget->accessibleDescription() + widget->toolTip();
             if (button)
-                said += button->text();
+                said += u' ' + button->text();
             if (const auto* label = qobject_cast<const QLabel*>(widget))
-                said += label->text();
+                said += u' ' + label->text();
             if (const auto* box = qobject_cast<const QComboBox*>(widget))
-                said += box->placeholderText() + box->currentText() + rowsOf(*box->model());
+                said += u' ' + box->placeholderText() + u' ' + box->currentText() + u' ' + rowsOf(*box->model());
             if (const auto* line = qobject_cast<const QLineEdit*>(widget))
-                said += line->placeholderText();
+                said += u' ' + line->placeholderText();
             if (const auto* list = qobject_cast<const QListWidget*>(widget))
-                said += rowsOf(*list->model());
-            if (hasHebrew(said))
+                said += u' ' + rowsOf(*list->model());
+            if (hasHebrew(said, data))
                 result += u"Hebrew on an English page: %1: %2"_s.arg(nameOf(*widget), said);
         }
     }

@@ -2,12 +2,14 @@
 
 #include "app/Program.h"
 #include "common/AnsiCodePage.h"
+#include "drive/PageFaults.h"
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "platform/files/Files.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "views/kit/HoldButton.h"
+#include "views/kit/Overlay.h"
 #include "views/window/MainWindow.h"
 #include "views/window/MessagePanel.h"
 #include "views/window/PageView.h"
@@ -36,6 +38,12 @@ constexpr int betweenLooks = 2;       // milliseconds
 constexpr int longestWait = 120'000;  // milliseconds of work, or of a page that offers nothing
 constexpr int pressesOfTheEnd = 1500; // until a page counts as one without a way on
 constexpr int leavingIsRare = 12;     // one of so many drawn exits is pressed
+constexpr int goingAwayIsRare = 25;   // one of so many presses is the last of a customer on a kiosk
+constexpr int restOfEyes = 150;       // milliseconds until a page lies as it will
+constexpr int looksOfEyes = 8;
+constexpr int turnOfClock = 1100; // milliseconds between two turns of the clock, which is asked each second
+constexpr std::chrono::seconds silence{
+    100}; // longer than a kiosk of a walk waits before it asks, and then for the answer
 
 // What a customer types, by the box; a box that is not named takes any of them.
 const QStringList names = {u"דנה לוי"_s, u"John O'Neil"_s, u"רות \"רותי\" כהן"_s, u"A"_s,
@@ -133,6 +141,23 @@ constexpr WayRow wayOn[] = {
     {u"UploadForm", u"Command28"},
     {u"UploadForm", u"Command10"},
     {u"UploadForm", u"Image5"},
+};
+
+// Where the way back begins on each page; one of them can be pressed whenever nothing is at work.
+constexpr WayRow wayBack[] = {
+    {u"nnn", u"Command4 Command2 Image1(5) Image1(7) Command9"},
+    {u"kyoskNew", u"changeDetails Image10 Command10 Command4 Command5 helpClose"},
+    {u"tFrmNew", u"CommandDone hintsClose"},
+    {u"mikledet", u"CommandDone"},
+    {u"RedI", u"Image9"},
+    {u"Form3", u"Command3"},
+    {u"Havharot", u"Command1"},
+    {u"MoogMeret", u"Command28 Command4Orders"},
+    {u"SpltForm", u"Image3"},
+    {u"B3", u"Command7 Command2 Command4Hazor"},
+    {u"Form2", u"Command7 Command4Hazor"},
+    {u"FtpFrm", u"changeOrder Command28 Command11 Image3 Command15 Command4Hazor"},
+    {u"UploadForm", u"changeOrder Command28 endClose Image3 Command15 Command4Hazor"},
 };
 
 // Controls that end the program.
@@ -233,6 +258,7 @@ void RandomWalk::walk(Program& program) {
     m_held.reset();
     m_acting = m_inTheMiddle = false;
     m_said = 0;
+    m_away = false;
     const Files& files = program.platform().files;
     program.dialogs().nextPick = [this, &files]() -> std::optional<DrivePath> {
         const DrivePath folder = files.drives().toDrive(toHostPath(drawn(m_plan.folders)));
@@ -331,7 +357,9 @@ void RandomWalk::step() {
     const QStringList& said = m_program->dialogs().shownTexts;
     for (; m_said < said.size(); ++m_said)
         write({{u"said"_s, said[m_said]}});
-    if (answerPanel())
+    if (m_away)
+        m_away = isAway();
+    if (m_away || isStillLooking() || answerPanel())
         return;
     if (m_acting || m_program->platform().pump.pumping()) {
         if (m_sinceAct.elapsed() > longestWait)
@@ -347,6 +375,14 @@ void RandomWalk::step() {
         return stop({});
     // Only a press uses up what the seed draws, however long the page lets it wait.
     const std::mt19937 before = m_random;
+    if (m_plan.clock && m_acts < m_plan.presses && !m_program->chain().front()->isUntouched() &&
+        draw(goingAwayIsRare) == 0) {
+        write({{u"away"_s, m_front}});
+        m_away = true;
+        m_sinceGone.start();
+        m_sinceTurned.start();
+        return;
+    }
     const bool atWork = m_front == u"kyoskNew" || m_front == u"tFrmNew" || m_front == u"mikledet" || m_front == u"RedI";
     const bool onTheWay = m_acts >= m_plan.presses ? draw(10) > 0 : draw(atWork ? 4 : 2) == 0;
     std::optional<Act> act = onTheWay ? nextOnTheWay() : std::nullopt;
@@ -358,6 +394,100 @@ void RandomWalk::step() {
     m_random = before;
     if (m_sinceAct.elapsed() > longestWait)
         stop(u"%1 has no way on"_s.arg(m_front));
+}
+
+// Each state of a page is looked at once, when it has come to rest.
+bool RandomWalk::isStillLooking() {
+    const PageView* view = m_program->window().frontView();
+    if (!view)
+        return false;
+    m_program->window().renderNow();
+    const QWidget* panel = frontOverlay(m_program->window());
+    const QWidget& seenNow = panel ? *panel : static_cast<const QWidget&>(*view);
+    QString sight = m_front + (m_program->state().english() ? u" English"_s : u" Hebrew"_s);
+    for (const QWidget* widget : seenNow.findChildren<QWidget*>()) {
+        const auto* label = qobject_cast<const QLabel*>(widget);
+        if (widget->isVisible() && !widget->objectName().startsWith(u"qt_"))
+            sight += u' ' + (panel && label ? label->text() : widget->objectName());
+    }
+    if (m_looked.contains(sight))
+        return false;
+    if (std::exchange(m_sight, sight) != sight) {
+        m_sinceSight.start();
+        m_looks = 0;
+        m_faults.reset();
+    }
+    // On a busy machine the time may pass before anything is laid out.
+    if (++m_looks < looksOfEyes || m_sinceSight.elapsed() < (m_faults ? 10 : 1) * restOfEyes)
+        return true;
+    QStringList data = m_plan.folders + names + telephones + addresses + mailNames + notes;
+    for (const QString& folder : m_plan.folders)
+        data += QDir(folder).entryList(QDir::Files);
+    if (const auto frames = m_program->platform().files.drives().toHost(DrivePath(u"C:\\2000lumora\\misgarot"_s)))
+        data += QDir(QString::fromStdString(frames->string())).entryList(QDir::Dirs);
+    for (const auto& shop : m_program->state().profile.Shops)
+        data += shop.name;
+    const QStringList faults = pageFaults(*m_program, data.join(u' ')) + missingWays(*view);
+    const bool again = !m_faults && !faults.isEmpty();
+    if (again) { // what moves is none
+        m_faults = faults;
+        m_sinceSight.start();
+        m_looks = 0;
+        return true;
+    }
+    m_looked += sight;
+    for (const QString& fault : faults) {
+        if (m_faults->contains(fault))
+            write({{u"fault"_s, fault}, {u"where"_s, m_front}, {u"english"_s, m_program->state().english()}});
+    }
+    return false;
+}
+
+// A panel's own buttons are its ways. What is at work goes on by itself.
+QStringList RandomWalk::missingWays(const PageView& view) {
+    const auto canBePressed = [](const QWidget* widget) {
+        return canBeUsed(*widget) && ControlFinder::whyNotPressable(*widget).isEmpty();
+    };
+    if (const Overlay* panel = frontOverlay(m_program->window())) {
+        const auto buttons = panel->findChildren<QAbstractButton*>();
+        return std::any_of(buttons.begin(), buttons.end(), canBePressed) ? QStringList()
+                                                                         : QStringList(u"no way out of a panel"_s);
+    }
+    if (m_acting || m_program->chain().isAnyWorking() || m_program->platform().pump.pumping())
+        return {};
+    QStringList missing;
+    const std::vector<QWidget*> widgets = usable(view);
+    const auto leads = [&](const WayRow& row) {
+        if (m_front != QString::fromUtf16(row.page))
+            return false;
+        const QStringList controls = QString::fromUtf16(row.controls).split(u' ');
+        return std::any_of(widgets.begin(), widgets.end(), [&](const QWidget* widget) {
+            return canBePressed(widget) && std::any_of(controls.begin(), controls.end(),
+                                                       [&](const QString& name) { return goesBy(*widget, name); });
+        });
+    };
+    if (!isPreparing(m_front) && !isSending(m_front) && std::none_of(std::begin(wayOn), std::end(wayOn), leads))
+        missing += u"no way on"_s;
+    if (m_front != u"hatchala" && std::none_of(std::begin(wayBack), std::end(wayBack), leads))
+        missing += u"no way back"_s;
+    return missing;
+}
+
+// The start page comes by itself, in the first language and with nothing of the customer who has gone.
+bool RandomWalk::isAway() {
+    const Page* front = m_program->chain().front();
+    if (front && front->id() == PageId::hatchala && front->isUntouched() && !m_program->dialogs().isWaiting() &&
+        !frontOverlay(m_program->window())) {
+        write({{u"idled"_s, true}});
+        return false;
+    }
+    if (m_sinceTurned.elapsed() > turnOfClock) {
+        m_plan.clock->ahead += silence;
+        m_sinceTurned.start();
+    }
+    if (m_sinceGone.elapsed() > longestWait)
+        stop(u"nobody is there, and the start page does not come from %1"_s.arg(m_front));
+    return true;
 }
 
 // The order was sent, or the start page tells that it stays at this station.

@@ -2,6 +2,7 @@
 
 #include "common/Result.h"
 #include "drive/ControlFinder.h"
+#include "platform/SystemClock.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -22,13 +23,22 @@ namespace lumora {
 class PageView;
 class Program;
 
+// A clock that a walk turns on in place of waiting.
+class WalkClock : public SystemClock {
+public:
+    std::chrono::milliseconds running() const override { return SystemClock::running() + ahead; }
+    std::chrono::milliseconds ahead{0};
+};
+
 // A customer who presses whatever can be pressed, as a seed draws it, and then brings the order to its end. Before each
 // press all that the page in front shows is written down, so that another program can compare the order with it.
 //
 // seen.jsonl has an object a line. "act" is a press as a scenario says it, with "page", "shown" (text by control),
 // "marked" (controls that are ticked) and "words" (labels without a name), all from before the press; "front" is a page
-// that came to the front, "said" a box or a question. Beside it "<n>" holds the order folders of the moment when line n
-// told of a page, and "preview.<n>.png" the editor's paper as it was last before another picture.
+// that came to the front, "said" a box or a question, "fault" what a person could stumble over on the page in front,
+// which is looked at once in each state, "idled" the start page that came because nothing was pressed. Beside it "<n>"
+// holds the order folders of the moment when line n told of a page, and "preview.<n>.png" the editor's paper as it was
+// last before another picture.
 class RandomWalk : public QObject {
     Q_OBJECT
 public:
@@ -38,6 +48,7 @@ public:
         QStringList folders; // host paths of the folders of pictures
         QString record;      // host path of an existing folder
         Hand hand = Hand::Mouse;
+        WalkClock* clock = nullptr; // of a kiosk, where a customer may go away in the middle
     };
     explicit RandomWalk(Plan plan);
 
@@ -58,6 +69,9 @@ private:
     };
 
     void step();
+    bool isStillLooking();
+    QStringList missingWays(const PageView& view);
+    bool isAway();
     bool hasOrderEnded();
     bool answerPanel();
     void pressInTheMiddle();
@@ -106,6 +120,14 @@ private:
     QString m_front;
     QString m_beforeFront;
     bool m_fromOrder = false; // the page before the one in front prepared or sent an order
+    QSet<QString> m_looked;   // states of pages
+    QString m_sight;
+    QElapsedTimer m_sinceSight;
+    int m_looks = 0;
+    std::optional<QStringList> m_faults; // of the first look
+    bool m_away = false;                 // the customer has gone
+    QElapsedTimer m_sinceGone;
+    QElapsedTimer m_sinceTurned; // of the clock
     bool m_over = false;
     QString m_failure;
 };

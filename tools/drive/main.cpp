@@ -78,6 +78,8 @@ int play(int argc, char** argv) {
           u"Presses once more, soon and at the same place or by the same key, behind each press that changes what is in front."_s},
          {u"walk"_s, u"In place of scenarios: presses what can be pressed, as this number draws it."_s, u"SEED"_s},
          {u"presses"_s, u"Of a walk, before it brings the order to its end."_s, u"NUMBER"_s, u"300"_s},
+         {u"away"_s,
+          u"Of a walk on a kiosk: now and then the customer goes, and the start page must come by itself."_s},
          {u"record"_s, u"Of a walk: an existing folder for what the pages showed."_s, u"DIR"_s, u"."_s}});
     parser.addPositionalArgument(u"SCENARIO..."_s,
                                  u"The files, played one after the other; of a walk the folders of pictures."_s);
@@ -102,8 +104,11 @@ int play(int argc, char** argv) {
         return complain(u"Presses come by --touch or by --keys"_s, notPlayed);
     const Hand hand = parser.isSet(u"touch"_s) ? Hand::Finger : parser.isSet(u"keys"_s) ? Hand::Keys : Hand::Mouse;
     if (parser.isSet(u"walk"_s)) {
+        WalkClock clock;
+        options.clock = &clock;
         RandomWalk seeded({parser.value(u"walk"_s).toUInt(), parser.value(u"presses"_s).toInt(),
-                           parser.positionalArguments(), parser.value(u"record"_s), hand});
+                           parser.positionalArguments(), parser.value(u"record"_s), hand,
+                           parser.isSet(u"away"_s) ? &clock : nullptr});
         return walk(seeded, options);
     }
     std::vector<ScenarioFile> files;
