@@ -85,19 +85,20 @@ void rolesOf(QAccessibleInterface* node, QStringList& faults) {
 
 // Named in another language than the page has. In Hebrew a name or a number may stand in Latin letters where it is
 // shown so.
-void foreignNames(QAccessibleInterface* node, bool english, QStringList& faults) {
+void foreignNames(QAccessibleInterface* node, bool english, const QString& typed, QStringList& faults) {
     if (!node || !node->object() || node->state().invisible || node->object()->property("letterOfAnyLanguage").toBool())
         return;
     const QString name = node->text(QAccessible::Name);
     const auto* button = qobject_cast<QAbstractButton*>(node->object());
     static const QRegularExpression latinWord(u"[A-Za-z]{3,}"_s), data(u"\\.\\w+$|@"_s);
     const bool shown = !button || isolated(button->text()).contains(isolated(name));
-    if (english ? hasHebrew(name) : !shown && !hasHebrew(name) && name.contains(latinWord) && !name.contains(data))
+    if (english ? hasHebrew(name, typed)
+                : !shown && !hasHebrew(name) && name.contains(latinWord) && !name.contains(data))
         faults += u"%1 is called \"%2\""_s.arg(nameOf(*node), name);
     if (node->role() == QAccessible::ComboBox || node->role() == QAccessible::List)
         return; // rows are data
     for (int i = 0; i < node->childCount(); ++i)
-        foreignNames(node->child(i), english, faults);
+        foreignNames(node->child(i), english, typed, faults);
 }
 
 void unnamed(QAccessibleInterface* node, QStringList& faults) {
@@ -213,7 +214,7 @@ QStringList pageFaults(Program& program, const QString& data) {
     unnamed(QAccessible::queryAccessibleInterface(&window), result);
     QAccessibleInterface* const spoken = QAccessible::queryAccessibleInterface(&window);
     rolesOf(spoken, result);
-    foreignNames(spoken, english, result);
+    foreignNames(spoken, english, data, result);
     const Overlay* panel = frontOverlay(window);
     if (panel) {
         QAccessibleInterface* const box = QAccessible::queryAccessibleInterface(const_cast<Overlay*>(panel));
@@ -300,6 +301,27 @@ QStringList pageFaults(Program& program, const QString& data) {
             if (hasHebrew(said, data))
                 result += u"Hebrew on an English page: %1: %2"_s.arg(nameOf(*widget), said);
         }
+    }
+    return result;
+}
+
+QStringList overlaps(Program& program) {
+    QStringList result;
+    QList<std::pair<const QWidget*, QRect>> seen;
+    const Overlay* panel = frontOverlay(program.window());
+    const QWidget* root = panel ? static_cast<const QWidget*>(panel) : program.window().frontView();
+    for (const QWidget* control : root->findChildren<QWidget*>()) {
+        if (!control->isVisible() ||
+            !(qobject_cast<const QAbstractButton*>(control) || qobject_cast<const QLineEdit*>(control) ||
+              qobject_cast<const QComboBox*>(control)))
+            continue;
+        const QRect place =
+            control->visibleRegion().boundingRect().translated(control->mapTo(control->window(), QPoint()));
+        for (const auto& [other, where] : seen) {
+            if (where.intersects(place) && !other->isAncestorOf(control) && !control->isAncestorOf(other))
+                result += u"%1 lies over %2"_s.arg(nameOf(*control), nameOf(*other));
+        }
+        seen += {control, place};
     }
     return result;
 }
