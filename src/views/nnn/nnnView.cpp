@@ -223,8 +223,7 @@ void nnnView::makeBars() {
     frame().addSecondaryActions({m_back, button(c.Command2, Role::Quiet, &nnn::Command2_Click),
                                  button(c.Command15, Role::Secondary, &nnn::Command15_Click, u"info"_s),
                                  button(c.Command14, Role::Secondary, &nnn::Command14_Click, u"eraser"_s)});
-    frame().addStatus(
-        {label(c.Choice, "strong"), sign(u"phone"_s, IconSize::Small), lineLabel(c.Label4Tel, "muted")});
+    frame().addStatus({label(c.Choice, "strong"), sign(u"phone"_s, IconSize::Small), lineLabel(c.Label4Tel, "muted")});
     frame().addMainActions(
         {button(c.Command12, Role::Main, &nnn::Command12_Click), button(c.Command8, Role::Main, &nnn::Command8_Click),
          button(c.Command6, Role::Main, &nnn::Command6_Click), button(c.Command3, Role::Main, &nnn::Command3_Click)});
