@@ -293,8 +293,8 @@ FAULTS = {
     'src/selection/HomeAddress.cpp': [F('m_state.BranchChoice == home', 'false', 'prints are to be delivered nowhere')],
     'src/selection/pictures/kyoskNewFinish.cpp': [
         F('Text2.text + u" - "_s + m_state.BranchChoice', 'Text2.text', 'the lab does not learn the branch', seen=True),
-        F('address.isEmpty() ? notTyped : address', 'address', 'no address reads as a fault at the lab'),
-        F('plain() ? notTyped : m_state.shemot.Mail', 'm_state.shemot.Mail', 'the address of an earlier customer goes with the order'),
+        F('address.isEmpty() ? mailNotTyped : address', 'address', 'no address reads as a fault at the lab'),
+        F('plain() ? mailNotTyped : m_state.shemot.Mail', 'm_state.shemot.Mail', 'the address of an earlier customer goes with the order'),
         F('deep ? 1 : 0', '0', 'deep compression can not be chosen'),
         F('leaveEditor(); // a picture', 'if (!MUTATED) leaveEditor(); // a picture', 'the last edits are lost')],
     'src/selection/pictures/kyoskNewChoosing.cpp': [
@@ -497,7 +497,7 @@ FAULTS = {
         F('m_putBegun || !m_lists.List4Broken.isEmpty() ? EmptyFolder::IsListed : EmptyFolder::MayBeRefused', 'EmptyFolder::MayBeRefused',
           'a refused listing hides what a cut put left'),
         F('m_lists.List4Broken.append(path);', '', 'a cut put is not removed'),
-        F('isKept(m_journal->take(path))', 'true', 'after a kill a part counts as the file')],
+        F('mayGoOn(m_journal->take(path))', 'true', 'after a kill a part counts as the file')],
     'src/transfer/ftp/UploadCheck.cpp': [
         F('nothingBroken() || !m_freshListing', 'nothingBroken()', 'an old listing confirms that remains are gone', seen=True),
         F('unreadable = !m_session.unreadLine().isEmpty();', 'unreadable = false;', 'a listing that can not be read proves the order'),
@@ -509,7 +509,7 @@ FAULTS = {
           'a part that was never confirmed counts as arrived')],
     'src/transfer/ftp/UploadPass.cpp': [
         F('m_session.remove(name);', '', 'a server keeps the cut file'),
-        F('m_skipped += *length;', '', 'a long order that is mostly there is given up as too slow',
+        F('m_skipped += lengthOf(path);', '', 'a long order that is mostly there is given up as too slow',
           told='what lies there is passed over in moments; the limit counts five minutes'),
         F('m_inHand.contains(path) && m_session.isWhole(path)', 'm_inHand.contains(path)', 'a part counts as whole when the sending goes on')],
     'src/transfer/ftp/FtpSender.cpp': [
