@@ -58,8 +58,12 @@ int writeSupportBundle(const ProgramOptions& options, const HostPath& target) {
         return 1;
     }
     std::printf("%s is ready to be sent. It holds no customer's name and no password.\n", qPrintable(toText(target)));
-    if (lab.errors.isEmpty() && !lab.deployment.KeepLog)
+    std::error_code error;
+    if (!lab.deployment.KeepLog)
         std::puts("There is no log in it: the lab's file has [Log] Keep = no.");
+    else if (!std::filesystem::exists(KeptLog::usualPath(), error))
+        std::puts("There is no log in it: where systemd starts the program it is in the journal. Send it along: "
+                  "journalctl -u lumora-kiosk >log.txt");
     return 0;
 }
 

@@ -57,8 +57,8 @@ bool isLoggedFromStandardError() {
 }
 
 QString withoutCustomer(const QString& text) {
-    // A path ends where the reason begins, since a folder's name may hold blanks.
-    static const QRegularExpression places(u"(\\b[a-z]+://|(?<![\\w.])[A-Za-z]:\\\\|(?<![\\w.])/).*?(?=: |$)"_s,
+    // A path ends where the last reason begins: a folder's name may hold blanks and colons.
+    static const QRegularExpression places(u"(\\b[a-z]+://|(?<![\\w.])[A-Za-z]:\\\\|(?<![\\w.])/)(.*(?=: )|.*)"_s,
                                            QRegularExpression::DotMatchesEverythingOption);
     static const QRegularExpression mails(u"\\S+@\\S+"_s);
     static const QRegularExpression numbers(u"[0-9][0-9 -]{3,}[0-9]"_s);

@@ -82,6 +82,8 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
     checkHosts();
     if (m_lab.deployment.TachanaMekomit)
         tell(Good, u"server"_s, u"none: a local station keeps its orders"_s);
+    else if (m_lab.deployment.SugSheliach == Sender::Http)
+        tell(Good, u"server"_s, u"orders go by HTTP, to the host that was tried above; the FTP server is not tried"_s);
     else
         checkServer(server);
     return m_good;

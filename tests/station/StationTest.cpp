@@ -40,6 +40,7 @@ TEST(StationLogTest, AWarningTellsNoPathAddressOrNumber) {
     } cases[] = {
         {u"/media/x/Dana Levi/a b.jpg: no space left"_s, u"(path): no space left"_s},
         {u"C:\\2000lumora\\zmany\\Dana.jpg: damaged"_s, u"(path): damaged"_s},
+        {u"/media/x/for: Dana Levi/a.jpg: no space left"_s, u"(path): no space left"_s},
         {u"can't keep /srv/Dana"_s, u"can't keep (path)"_s},
         {u"http://report.example/p.asp?t1=Dana Levi&t2=052: the server answered 404"_s,
          u"(path): the server answered 404"_s},

@@ -7,7 +7,6 @@
 #include <QDBusPendingReply>
 
 #include <algorithm>
-#include <cstdio>
 #include <utility>
 
 namespace lumora {
@@ -71,10 +70,6 @@ UdisksMedia::UdisksMedia(QString address, Warn warn)
 
 UdisksMedia::~UdisksMedia() {
     QDBusConnection::disconnectFromBus(m_connectionName);
-}
-
-void UdisksMedia::warnOnStderr(const QString& text) {
-    std::fprintf(stderr, "lumora: %s\n", qPrintable(text));
 }
 
 void UdisksMedia::begin() {

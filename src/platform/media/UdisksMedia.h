@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/Warning.h"
 #include "platform/media/RemovableMedia.h"
 
 #include <QDBusConnection>
@@ -19,7 +20,7 @@ public:
     using Warn = std::function<void(const QString& text)>;
 
     // address: of the bus; empty for that of the system.
-    explicit UdisksMedia(QString address = {}, Warn warn = warnOnStderr);
+    explicit UdisksMedia(QString address = {}, Warn warn = writeWarning);
     ~UdisksMedia() override;
 
     void begin() override;
@@ -32,7 +33,6 @@ private Q_SLOTS:
     void ownerChanged(const QString& service, const QString& before, const QString& now);
 
 private:
-    static void warnOnStderr(const QString& text);
     void look();
     bool isCustomers(const QString& block) const;
     void mount(const QString& block);

@@ -44,7 +44,7 @@ Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, c
     if (!made)
         return made.failure();
     if (made->profileIgnored)
-        writeWarning(toText(source.filename()) + profileIgnoredWords.toString());
+        writeWarning(toText(source) + profileIgnoredWords.toString());
     std::error_code passedOver;
     if (!untold && std::filesystem::last_write_time(source, passedOver) == time)
         std::filesystem::last_write_time(target, time, passedOver);

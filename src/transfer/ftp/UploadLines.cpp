@@ -118,7 +118,7 @@ std::optional<UploadLines::Ended> UploadLines::wait(std::chrono::milliseconds mo
         return told;
     }
     line.connection.reset();
-    if (line.puts >= enoughPuts)
+    if (line.puts >= enoughPuts && !m_closed)
         open(line);
     return told;
 }

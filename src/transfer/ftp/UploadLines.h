@@ -22,6 +22,8 @@ public:
 
     // first: stands where the files go. The others are opened at once.
     UploadLines(Open open, int lines, std::unique_ptr<FtpConnection> first);
+    // No line is opened any more.
+    void close() { m_closed = true; }
     // Waits for the calls under way.
     ~UploadLines();
     UploadLines(const UploadLines&) = delete;
@@ -55,6 +57,7 @@ private:
     Open m_open;
     std::unique_ptr<Calls> m_calls;
     std::vector<std::unique_ptr<Line>> m_lines;
+    bool m_closed = false;
 };
 
 } // namespace lumora

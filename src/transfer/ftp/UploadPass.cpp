@@ -174,8 +174,10 @@ QSet<int> UploadPass::goByLines(int from) {
     UploadLines lines(m_session.opener(), std::min(most, static_cast<int>(waiting.size())), m_session.lend());
     int endedEarly = 0; // sessions, behind their first file
     const auto settleEnded = [&] {
-        if (ends())
+        if (ends()) {
+            lines.close();
             m_platform.internet.abort();
+        }
         const auto ended = lines.wait(betweenPumps);
         m_platform.pump.pump();
         if (!ended)
@@ -199,14 +201,19 @@ QSet<int> UploadPass::goByLines(int from) {
     }
     while (lines.isPutting())
         settleEnded();
+    lines.close();
     m_session.takeBack(lines.takeOne());
-    // A server that lets no more in may keep the others waiting for their greeting.
-    const auto until = m_platform.clock.running() + mostOpening;
-    while (lines.isOpening() && !ends() && m_platform.clock.running() < until)
-        settleEnded();
-    if (lines.isOpening()) {
+    if (!m_keeps)
         m_session.FtpCloseConnection();
-        m_platform.internet.abort();
+    // A server that lets no more in may keep the others waiting for their greeting. A line that has only begun to open
+    // is reached by a later round.
+    const auto until = m_platform.clock.running() + mostOpening;
+    while (lines.isOpening()) {
+        if (!ends() && m_platform.clock.running() >= until) {
+            m_session.FtpCloseConnection();
+            m_platform.internet.abort();
+        }
+        settleEnded();
     }
     return gone;
 }
