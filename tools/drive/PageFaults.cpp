@@ -305,25 +305,4 @@ QStringList pageFaults(Program& program, const QString& data) {
     return result;
 }
 
-QStringList overlaps(Program& program) {
-    QStringList result;
-    QList<std::pair<const QWidget*, QRect>> seen;
-    const Overlay* panel = frontOverlay(program.window());
-    const QWidget* root = panel ? static_cast<const QWidget*>(panel) : program.window().frontView();
-    for (const QWidget* control : root->findChildren<QWidget*>()) {
-        if (!control->isVisible() ||
-            !(qobject_cast<const QAbstractButton*>(control) || qobject_cast<const QLineEdit*>(control) ||
-              qobject_cast<const QComboBox*>(control)))
-            continue;
-        const QRect place =
-            control->visibleRegion().boundingRect().translated(control->mapTo(control->window(), QPoint()));
-        for (const auto& [other, where] : seen) {
-            if (where.intersects(place) && !other->isAncestorOf(control) && !control->isAncestorOf(other))
-                result += u"%1 lies over %2"_s.arg(nameOf(*control), nameOf(*other));
-        }
-        seen += {control, place};
-    }
-    return result;
-}
-
 } // namespace lumora

@@ -10,7 +10,5 @@ class Program;
 // All that a person could stumble over in what the window shows now; each line names the control. Words of data, which
 // customers have typed or their files are called, may stand in any language.
 QStringList pageFaults(Program& program, const QString& data = {});
-// Of two controls that lie over one another a finger can't tell which it presses.
-QStringList overlaps(Program& program);
 
 } // namespace lumora

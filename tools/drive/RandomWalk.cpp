@@ -427,7 +427,7 @@ bool RandomWalk::isStillLooking() {
         data += QDir(QString::fromStdString(frames->string())).entryList(QDir::Dirs);
     for (const auto& shop : m_program->state().profile.Shops)
         data += shop.name;
-    const QStringList faults = pageFaults(*m_program, data.join(u' ')) + overlaps(*m_program) + missingWays(*view);
+    const QStringList faults = pageFaults(*m_program, data.join(u' ')) + missingWays(*view);
     const bool again = !m_faults && !faults.isEmpty();
     if (again) { // what moves is none
         m_faults = faults;

@@ -172,10 +172,13 @@ QWidget* tFrmNewView::makeFramesAndMore() {
     QLayout* steps = makeFrameSteps();
     QLayout* use = inRow(Space::Tight, {tool(c.Image22, u"frame"_s, wide, &tFrmNew::Image22_Click),
                                         tool(c.Image28, u"frame-off"_s, wide, &tFrmNew::Image28_Click)});
-    QFrame* frames =
+    m_frameTools =
         group(c.framesTitle,
               {m_categories, {m_frames, 1}, steps, use, checkBox(c.Misgerett, toPage(&tFrmNew::Misgerett_Click))});
-    QWidget* box = inBox(inColumn(Space::Small, {m_moreTools, {frames, 1}}));
+    QSizePolicy keepsItsPlace = m_frameTools->sizePolicy();
+    keepsItsPlace.setRetainSizeWhenHidden(true);
+    m_frameTools->setSizePolicy(keepsItsPlace);
+    QWidget* box = inBox(inColumn(Space::Small, {m_moreTools, {m_frameTools, 1}}));
     box->setFixedWidth(theme().px(columnWidth));
     return box;
 }
@@ -286,6 +289,7 @@ void tFrmNewView::render() {
     const bool uncovered = m_covered == 0;
     m_nearTools->setVisible(uncovered && c.Picture3.visible);
     m_farTools->setVisible(uncovered && c.Picture3.visible);
+    m_frameTools->setVisible(!c.Frame3.visible); // the tones lie in their place
     m_strip->setVisible(uncovered);
     m_help->setVisible(uncovered); // a panel would cover the button that closes the hints
     m_undo->setVisible(c.Picture3.visible);
