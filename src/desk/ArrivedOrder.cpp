@@ -20,15 +20,22 @@ namespace fs = std::filesystem;
 
 namespace {
 
-QStringList filesOf(const fs::path& folder) {
+Result<QStringList> filesOf(const fs::path& folder) {
     QStringList names;
     std::error_code error;
-    for (fs::directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
-        std::error_code gone;
+    fs::directory_iterator at(folder, error);
+    for (const fs::directory_iterator end; !error && at != end; at.increment(error)) {
+        std::error_code asked;
         const QString name = toText(at->path().filename());
-        if (!name.startsWith(u'.') && at->is_regular_file(gone))
+        if (name.startsWith(u'.'))
+            continue;
+        if (at->is_regular_file(asked))
             names += name;
+        else if (asked && asked != std::errc::no_such_file_or_directory)
+            return fileFailure(at->path(), u"can't be read"_s, asked.value());
     }
+    if (error)
+        return fileFailure(folder, u"can't be listed"_s, error.value());
     names.sort();
     return names;
 }
@@ -102,8 +109,10 @@ Result<ArrivedOrder> ArrivedOrder::judge(const fs::path& given, PrintFileShape s
         return fileFailure(given, u"can't be read"_s, error.value());
     ArrivedOrder order;
     order.name = toText(folder.filename());
-    const QStringList names = filesOf(folder);
-    const QMap<QString, CutFile> cut = cutFilesAmong(names);
+    const Result<QStringList> names = filesOf(folder);
+    if (!names)
+        return names.failure();
+    const QMap<QString, CutFile> cut = cutFilesAmong(*names);
     for (auto file = cut.cbegin(); file != cut.cend(); ++file) {
         if (const QString missing = missingOf(file.key(), *file); !missing.isEmpty())
             order.missing += missing;
@@ -111,7 +120,7 @@ Result<ArrivedOrder> ArrivedOrder::judge(const fs::path& given, PrintFileShape s
     if (!order.missing.isEmpty())
         return order;
     if (!cut.isEmpty()) {
-        const Result<fs::path> whole = joinedFolder(folder, names, cut, room);
+        const Result<fs::path> whole = joinedFolder(folder, *names, cut, room);
         if (!whole)
             return whole.failure();
         folder = *whole;
@@ -124,12 +133,19 @@ Result<ArrivedOrder> ArrivedOrder::judge(const fs::path& given, PrintFileShape s
     order.findings = *findings;
     order.missing = findings->faults;
     const QString sheet = SheetName(OrderNumberOf(order.findings.order), {}, {});
-    for (const QString& name : filesOf(folder)) {
+    const Result<QStringList> checked = filesOf(folder);
+    if (!checked)
+        return checked.failure();
+    for (const QString& name : *checked) {
         if (const auto parts = PrintFileName::parse(name))
             order.prints.push_back({name, *parts, folder / toHostPath(name)});
         else if (name.startsWith(sheet))
             order.sheet = folder / toHostPath(name);
     }
+    if (order.missing.isEmpty() && static_cast<int>(order.prints.size()) != order.findings.prints)
+        return Failure{Failure::Kind::Other, u"%1: %2 prints were checked, %3 are listed"_s.arg(order.name)
+                                                 .arg(order.findings.prints)
+                                                 .arg(order.prints.size())};
     return order;
 }
 

@@ -19,7 +19,8 @@ using State = DeskOrder::State;
 namespace {
 
 constexpr qint64 hour = 3600000;
-constexpr qint64 shortest = 100; // of a pause; else an order that stays faulty would keep the others waiting
+const QString byHand = u"~export"_s; // ends the key of a room that an export has
+constexpr qint64 shortest = 100;     // of a pause; else an order that stays faulty would keep the others waiting
 
 // The prints of an order, one row for all of the same words.
 QList<DeskOrder::Prints> printsOf(const ArrivedOrder& order) {
@@ -50,18 +51,21 @@ void count(DeskOrder& order, const QList<DeskOrder::Prints>& prints, const Arriv
 } // namespace
 
 Result<void> DeskWatch::begin() {
-    const Result<QList<DeskOrder>> orders = m_book.list({State::Faulty, State::Placed});
+    // Before the book is asked: a room of an order that is taken up after that is none of these.
+    const QStringList rooms = m_hotFolder.rooms();
+    const Result<QList<DeskOrder>> orders = m_book.list({State::Faulty, State::Placed, State::Gone});
     if (!orders)
         return orders.failure();
-    QSet<QString> placed;
+    QSet<QString> ended;
     for (const DeskOrder& order : *orders) {
-        if (order.state == State::Placed)
-            placed += order.name;
-        else
+        if (order.state == State::Faulty)
             m_tell(Tone::Fault, u"%1: %2"_s.arg(order.name, order.words));
+        else
+            ended += order.name;
     }
-    for (const QString& room : m_hotFolder.rooms()) {
-        if (placed.contains(HotFolder::keyOf(room)))
+    for (const QString& room : rooms) {
+        const QString key = HotFolder::keyOf(room);
+        if (ended.contains(key) || (key.endsWith(byHand) && m_hotFolder.isOld(room)))
             m_hotFolder.clear(room);
     }
     return {};
@@ -175,8 +179,16 @@ Result<bool> DeskWatch::lookAt(DeskOrder order) {
     // An order that ends this process is not the first one of the next process again.
     ++order.tries;
     order.due = *now + pause(order);
+    // Rooms of earlier tries. They are listed before the save: once it is confirmed, no other process can make the
+    // order ready with one of them, but may with a room that comes later.
+    QStringList old = m_hotFolder.rooms();
+    old.removeIf([&](const QString& room) { return HotFolder::keyOf(room) != order.name; });
     const Result<bool> held = m_book.save(order, Book::Then::Hold);
-    return held && *held ? judge(order) : held;
+    if (!held || !*held)
+        return held;
+    for (const QString& room : old)
+        m_hotFolder.clear(room);
+    return judge(order);
 }
 
 Result<bool> DeskWatch::judge(DeskOrder order) {
@@ -230,7 +242,10 @@ Result<bool> DeskWatch::makeReady(DeskOrder order, const QString& room, const Ar
     order.desk = m_hotFolder.id();
     order.room = room;
     order.ready = *now;
-    return save(order, 0, {prints, {}});
+    const Result<bool> saved = save(order, 0, {prints, {}});
+    if (saved && !*saved)
+        m_hotFolder.clear(room);
+    return saved;
 }
 
 Result<bool> DeskWatch::place(DeskOrder order) {
@@ -268,7 +283,7 @@ QByteArray DeskWatch::lineOf(const DeskOrder& order) {
 Result<DeskOrder> exportOrder(const fs::path& folder, const HotFolder& hotFolder, const PrintLayout& layout,
                               PrintFileShape shape) {
     std::error_code error;
-    const QString key = toText(fs::weakly_canonical(folder, error).filename()) + u"~export"_s;
+    const QString key = toText(fs::weakly_canonical(folder, error).filename()) + byHand;
     const Result<QString> room = hotFolder.makeRoom(key);
     if (!room)
         return room.failure();

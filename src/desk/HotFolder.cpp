@@ -13,6 +13,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <chrono>
 #include <cstdio>
 
 namespace lumora {
@@ -37,8 +38,8 @@ int moveToNewName(const fs::path& from, const fs::path& to) {
         return errno;
     // Network file systems do not know the flag.
     std::error_code error;
-    if (fs::exists(to, error))
-        return EEXIST;
+    if (fs::exists(to, error) || error)
+        return error ? error.value() : EEXIST;
     return ::rename(from.c_str(), to.c_str()) == 0 ? 0 : errno;
 }
 
@@ -49,15 +50,20 @@ Result<void> syncFolder(const fs::path& folder) {
     return {};
 }
 
-// Relative to the folder.
-std::vector<fs::path> filesBelow(const fs::path& folder) {
+// Relative to the folder. A folder that can't be read is a failure: who clears the room takes the list for all.
+Result<std::vector<fs::path>> filesBelow(const fs::path& folder) {
     std::vector<fs::path> files;
     std::error_code error;
-    for (fs::recursive_directory_iterator at(folder, error), end; !error && at != end; at.increment(error)) {
-        std::error_code gone;
-        if (at->is_regular_file(gone))
+    fs::recursive_directory_iterator at(folder, error);
+    for (const fs::recursive_directory_iterator end; !error && at != end; at.increment(error)) {
+        std::error_code asked;
+        if (at->is_regular_file(asked))
             files.push_back(at->path().lexically_relative(folder));
+        else if (asked && asked != std::errc::no_such_file_or_directory)
+            return fileFailure(at->path(), u"can't be read"_s, asked.value());
     }
+    if (error)
+        return fileFailure(folder, u"can't be listed"_s, error.value());
     std::sort(files.begin(), files.end());
     return files;
 }
@@ -119,11 +125,25 @@ QStringList HotFolder::rooms() const {
     return names;
 }
 
+Result<void> HotFolder::checkId() const {
+    const fs::path idFile = m_folder / hidden / "id";
+    const Result<QByteArray> id = readWholeFile(idFile, toText(idFile), 64);
+    if (!id)
+        return id.failure();
+    if (QString::fromLatin1(*id) != m_id)
+        return Failure{Failure::Kind::NotFound, u"%1 is not the hot folder that it was"_s.arg(toText(m_folder))};
+    return {};
+}
+
+bool HotFolder::isOld(const QString& room) const {
+    std::error_code error;
+    const fs::file_time_type changed = fs::last_write_time(pathOf(room), error);
+    return !error && fs::file_time_type::clock::now() - changed > std::chrono::hours(24);
+}
+
 Result<QString> HotFolder::makeRoom(const QString& key) const {
-    for (const QString& room : rooms()) {
-        if (keyOf(room) == key)
-            clear(room);
-    }
+    if (const auto same = checkId(); !same)
+        return same.failure();
     const QString room = key + u'~' + newId();
     if (const auto made = makeFolders(pathOf(room) / outward); !made)
         return made.failure();
@@ -143,6 +163,8 @@ Result<void> HotFolder::makeReady(const QString& room, const ArrivedOrder& order
         for (const fs::path& taken : {out / place, m_folder / place}) {
             if (fs::exists(taken, error))
                 return Failure{Failure::Kind::InUse, u"%1: is there already"_s.arg(toText(m_folder / place))};
+            if (error)
+                return fileFailure(taken, u"can't be read"_s, error.value());
         }
         if (const auto made = makeFolders((out / place).parent_path()); !made)
             return made;
@@ -166,18 +188,23 @@ Result<void> HotFolder::makeReady(const QString& room, const ArrivedOrder& order
 }
 
 Result<void> HotFolder::place(const QString& room) const {
+    if (const auto same = checkId(); !same)
+        return same;
     const fs::path out = pathOf(room) / outward;
     std::error_code error;
     if (!fs::is_directory(out, error))
         return Failure{Failure::Kind::NotFound,
                        u"%1 was removed before all prints had moved to their places: look which ones came out, and "
                        u"place the others by export"_s.arg(toText(out))};
-    for (const fs::path& file : filesBelow(out)) {
+    const Result<std::vector<fs::path>> files = filesBelow(out);
+    if (!files)
+        return files.failure();
+    for (const fs::path& file : *files) {
         const fs::path target = m_folder / file;
         if (const auto made = makeFolders(target.parent_path()); !made)
             return made;
         const int failed = moveToNewName(out / file, target);
-        if (failed == ENOENT && !fs::exists(out / file, error))
+        if (failed == ENOENT && !fs::exists(out / file, error) && !error)
             continue;
         if (failed != 0)
             return fileFailure(target, u"can't be placed"_s, failed);
@@ -185,10 +212,17 @@ Result<void> HotFolder::place(const QString& room) const {
         if (const auto synced = syncFolder(target.parent_path()); !synced)
             return synced;
     }
+    const Result<std::vector<fs::path>> left = filesBelow(out);
+    if (!left)
+        return left.failure();
+    if (!left->empty())
+        return Failure{Failure::Kind::Other, u"%1: has not moved to its place"_s.arg(toText(out / left->front()))};
     return {};
 }
 
 Result<void> HotFolder::addLine(const QString& list, const QByteArray& head, const QByteArray& line) const {
+    if (const auto same = checkId(); !same)
+        return same;
     const fs::path path = m_folder / toHostPath(list);
     const auto refuse = [&](int error) { return fileFailure(path, u"can't be written"_s, error); };
     const Descriptor file(::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0666));

@@ -22,12 +22,13 @@ public:
     // The same for all machines that see this folder.
     const QString& id() const { return m_id; }
 
-    // An empty room; what earlier tries have left under the same key is removed.
+    // An empty room. Fails, as place and addLine do, where the folder is no longer the one that was opened, as a share
+    // that was unmounted meanwhile.
     Result<QString> makeRoom(const QString& key) const;
     std::filesystem::path pathOf(const QString& room) const;
     void clear(const QString& room) const;
-    // The keys of the rooms that are there, each room once.
     QStringList rooms() const;
+    bool isOld(const QString& room) const; // nothing was added for a day
     static QString keyOf(const QString& room);
 
     // Writes the pictures of the print files and the sheet into the room, synced, each below the folder that it goes
@@ -46,6 +47,8 @@ private:
     HotFolder(std::filesystem::path folder, QString id)
         : m_folder(std::move(folder))
         , m_id(std::move(id)) {}
+
+    Result<void> checkId() const;
 
     std::filesystem::path m_folder;
     QString m_id;

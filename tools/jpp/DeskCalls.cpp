@@ -10,6 +10,7 @@
 
 #include <QCommandLineParser>
 #include <QDate>
+#include <QDeadlineTimer>
 #include <QDir>
 #include <QFileInfo>
 #include <QTextStream>
@@ -94,12 +95,13 @@ int DeskCalls::watch(const QString& folder) const {
         for (;;) {
             if (const auto looked = desk.look(); !looked)
                 return looked.failure();
-            for (;;) {
+            // Faulty orders are due again and again; they must not keep the new ones from being seen.
+            bool due = true;
+            for (const QDeadlineTimer turn(static_cast<qint64>(rest)); due && !turn.hasExpired();) {
                 const Result<bool> stepped = desk.step();
                 if (!stepped)
                     return stepped.failure();
-                if (!*stepped)
-                    break;
+                due = *stepped;
             }
             if (once) {
                 const Result<bool> done = desk.allDone();
@@ -110,7 +112,8 @@ int DeskCalls::watch(const QString& folder) const {
                     return faulty ? Result<bool>(faulty->isEmpty()) : Result<bool>(faulty.failure());
                 }
             }
-            QThread::msleep(rest);
+            if (!due)
+                QThread::msleep(rest);
         }
     };
     for (bool opened = false;;) {
