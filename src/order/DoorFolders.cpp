@@ -41,7 +41,8 @@ DrivePath newDoorFolder(const Files& files) {
 
 DrivePath doorFolderOf(const OrderState& order, const Files& files) {
     const QSet<QString> folders = foldersOf(order, files);
-    return order.keptIn.isEmpty() && !folders.isEmpty() ? DrivePath(*folders.begin()) : DrivePath(order.keptIn);
+    // Of several nobody knows which one is the order's own.
+    return order.keptIn.isEmpty() && folders.size() == 1 ? DrivePath(*folders.begin()) : DrivePath(order.keptIn);
 }
 
 void removeDoorFolders(const Files& files, const OrderState& order) {

@@ -101,7 +101,8 @@ ClosingEntries closingOf(const SessionState& state) {
 // stays as it is where one is gone.
 void giveWayBack(const UnfinishedOrder& order, SessionState& state, const Files& files) {
     state.handOver.takenUp = order.folder.path();
-    if (order.state.choices.isEmpty() || GonePictures(state, files, order) > 0)
+    const bool hasLeft = order.state.phase > OrderState::Phase::Prepared;
+    if (hasLeft || order.state.choices.isEmpty() || GonePictures(state, files, order) > 0)
         return;
     HandOver& back = state.handOver;
     back.basket = order.state.items;
@@ -111,6 +112,8 @@ void giveWayBack(const UnfinishedOrder& order, SessionState& state, const Files&
     }
     back.closing = closingOf(state);
     back.details = state.shemot;
+    back.details.Mail.clear();
+    back.details.Hearot.clear();
     back.doorFolder = doorFolderOf(order.state, files);
 }
 

@@ -1,5 +1,7 @@
 #include "platform/QueuePrinter.h"
 
+#include "common/Warning.h"
+
 #include <QProcess>
 #include <QTimer>
 
@@ -10,6 +12,8 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 
 namespace {
+
+constexpr int lastWait = 2000; // milliseconds, at the end of the program
 
 Result<void> queueOutcome(QProcess& child, bool endedByUs) {
     if (endedByUs)
@@ -32,8 +36,11 @@ QueuePrinter::QueuePrinter(QString program, std::chrono::milliseconds limit)
 QueuePrinter::~QueuePrinter() {
     for (QProcess* child : findChildren<QProcess*>()) {
         child->disconnect(this);
+        if (child->waitForFinished(lastWait))
+            continue;
+        writeWarning(u"%1 has not ended, and a slip is lost"_s.arg(child->program()));
         child->kill();
-        child->waitForFinished();
+        child->waitForFinished(lastWait);
     }
 }
 

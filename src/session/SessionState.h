@@ -225,7 +225,7 @@ struct HandOver {
     QStringList lines;
     bool pressStart = false; // the next page starts its work by itself once it is shown
     QString notice;          // a line for the customer that the start page shows
-    DrivePath takenUp;       // folder of the order whose preparation goes on; empty for a new order
+    DrivePath takenUp;       // folder of the order that goes on from another run; empty for a new order
     DrivePath replaced;      // folder of the order that the next one is prepared again from
     int renumbered = 0;      // times in a row that this was done
     QStringList basket;      // the lines that the page of pictures handed over, for the way back to it

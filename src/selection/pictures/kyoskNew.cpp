@@ -13,6 +13,7 @@
 #include "session/PageChain.h"
 #include "session/SessionState.h"
 #include "session/WebPages.h"
+#include "session/lab/MailDomains.h"
 
 #include <QTimer>
 
@@ -95,9 +96,9 @@ void kyoskNew::takeBack(const HandOver& before) {
     showPictureCount();
     showGuide(Guide::PicturesShown);
     Text1.text = before.closing.Text1;
-    Combo1.text = before.closing.Combo1;
-    Combo1Index = before.closing.Combo1Index;
     m_promptStands = before.closing.promptStands;
+    Combo1.text = m_promptStands ? mailDomainPrompt(m_state.english()) : before.closing.Combo1;
+    Combo1Index = before.closing.Combo1Index;
     Text2.text = before.closing.Text2;
     // Drawing pumps events, and this page is not shown yet.
     QTimer::singleShot(0, this, [this] {

@@ -6,6 +6,8 @@
 #include "order/OrderNames.h"
 #include "session/SessionState.h"
 
+#include <QTextBoundaryFinder>
+
 #include <algorithm>
 
 namespace lumora {
@@ -86,16 +88,17 @@ QString deliveryText(const SessionState& state) {
 
 // No line is cut where a word is longer than it.
 QString breakable(const QString& text) {
-    constexpr qsizetype longWord = 24;
+    constexpr int longWord = 24;
     QString result;
-    qsizetype letters = 0;
-    for (const QChar c : text) {
-        letters = c.isSpace() ? 0 : letters + 1;
+    int letters = 0;
+    QTextBoundaryFinder finder(QTextBoundaryFinder::Grapheme, text);
+    for (qsizetype at = 0, next = finder.toNextBoundary(); next > at; at = next, next = finder.toNextBoundary()) {
+        letters = text[at].isSpace() ? 0 : letters + 1;
         if (letters > longWord) {
             result += QChar(0x200B);
             letters = 1;
         }
-        result += c;
+        result += QStringView(text).sliced(at, next - at);
     }
     return result;
 }

@@ -89,6 +89,8 @@ void SendingPage::activate() {
     if (m_activated)
         return;
     m_activated = true;
+    const OrderJournal order(m_platform.files, OrderFolder::chosen(m_state));
+    m_slipAsked = order.known() && order.state().phase >= OrderState::Phase::Arrived; // by an earlier run
     if (m_leftOut.isDue())
         m_leftOut.open();
     begin();

@@ -17,7 +17,11 @@ PressElsewhere::PressElsewhere(QWidget& panel, QWidget& opener, std::function<vo
 
 bool PressElsewhere::eventFilter(QObject* watched, QEvent* event) {
     const auto* pressed = qobject_cast<QWidget*>(watched);
-    if (!pressed || !m_panel.isVisible())
+    // A page over this one, or a box before it, is nothing that closes the panel.
+    if (!pressed || !m_panel.isVisible() || pressed->window() != m_panel.window())
+        return false;
+    // A key that nobody takes goes on from parent to parent; it was meant for the first.
+    if (event->type() == QEvent::KeyPress && pressed != QApplication::focusWidget())
         return false;
     const auto lies = [&](const QWidget& in) {
         if (event->type() != QEvent::KeyPress)

@@ -182,6 +182,8 @@ void SendingView::renderPrints() {
 
 // Whole pixels for each module, so that a camera reads it.
 void SendingView::renderCode() {
+    if (!m_page.sendingControls().slipCode.visible || !m_code->pixmap(Qt::ReturnByValue).isNull())
+        return; // it does not change
     const QImage code = m_page.slipCode().image();
     if (code.isNull())
         return;
