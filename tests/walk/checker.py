@@ -187,8 +187,9 @@ class Walk:
         there = [base / folder for base in (self.lab / 'ftp/zalamim234', self.lab / 'uploads') if folder and (base / folder).is_dir()]
         if not there:
             return self.found.append(f'{folder} has arrived, says the page, and the server has no such folder')
+        # What is kept of a web server's list, and of broken files, never travels.
         for path in (kept / folder).iterdir():
-            if not path.name.startswith('.') and path.suffix in ('.jpp', '.txt', '.prk', '.jpg') and path.name != 'kashloo.txt':
+            if not path.name.startswith(('.', 'filelist', 'kashloo')) and path.suffix in ('.jpp', '.txt', '.prk', '.jpg'):
                 if not any((base / path.name).is_file() and (base / path.name).read_bytes() == path.read_bytes() for base in there):
                     self.found.append(f'{folder}/{path.name} has arrived, says the page, and the server has other bytes')
 

@@ -75,7 +75,7 @@ private:
     QWidget* m_nearTools = nullptr;
     QWidget* m_farTools = nullptr;
     QWidget* m_frameTools = nullptr; // among them
-    QFrame* m_moreTools = nullptr; // the first group of the far ones
+    QFrame* m_moreTools = nullptr;   // the first group of the far ones
     QWidget* m_strip = nullptr;
     QWidget* m_behindPanel = nullptr; // as high as what a panel covers
     std::array<StripCell*, cellsOfPage> m_cells{};
