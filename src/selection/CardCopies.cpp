@@ -1,9 +1,9 @@
 #include "selection/CardCopies.h"
 
+#include "common/Background.h"
 #include "common/HostFile.h"
 
 #include <algorithm>
-#include <thread>
 
 namespace lumora {
 
@@ -59,11 +59,11 @@ void CardCopies::startNext() {
     m_queue.pop_front();
     m_running = m_copies[picture.path].inHand = true;
     const Result<HostPath> target = m_kept.targetOf(DrivePath(picture.path));
-    std::thread([ticket = m_desk.ticket(), picture, target, stop = m_stop.get_token()] {
+    runInBackground([ticket = m_desk.ticket(), picture, target, stop = m_stop.get_token()] {
         const Copy copy = target ? copyWhole(picture, *target, stop)
                                  : Copy{State::NotKept, targetFailure(target.failure()), false, picture.source.stamp};
         ticket.handIn([path = picture.path, copy](CardCopies& copies) { copies.settle(path, copy); });
-    }).detach();
+    });
 }
 
 void CardCopies::settle(const QString& path, const Copy& copy) {

@@ -1,5 +1,7 @@
 #include "selection/SmallPictures.h"
 
+#include "common/Background.h"
+
 #include <QThreadPool>
 
 #include <optional>
@@ -11,9 +13,7 @@ using namespace Qt::StringLiterals;
 namespace {
 
 QThreadPool& reader() {
-    // Never ended: that would wait for a read from a card that hangs.
-    static QThreadPool& pool = *new QThreadPool;
-    pool.setMaxThreadCount(1);
+    static QThreadPool& pool = backgroundPool(1);
     return pool;
 }
 

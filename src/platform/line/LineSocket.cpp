@@ -1,5 +1,7 @@
 #include "platform/line/LineSocket.h"
 
+#include "common/Background.h"
+
 #include <Poco/Exception.h>
 #include <Poco/Net/IPAddress.h>
 #include <Poco/Net/NetException.h>
@@ -9,7 +11,6 @@
 #include <memory>
 #include <mutex>
 #include <optional>
-#include <thread>
 
 namespace lumora {
 namespace {
@@ -46,7 +47,7 @@ SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, c
         return SocketAddress(name, port);
 
     const auto answer = std::make_shared<NameAnswer>();
-    std::thread([answer, name, port] {
+    runInBackground([answer, name, port] {
         std::optional<SocketAddress> address;
         std::string failure;
         try {
@@ -61,7 +62,7 @@ SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, c
         answer->failure = failure;
         answer->done = true;
         answer->told.notify_one();
-    }).detach();
+    });
     std::unique_lock lock(answer->mutex);
     const auto limit =
         std::chrono::steady_clock::now() + std::chrono::microseconds(call.limits().connect.totalMicroseconds());

@@ -1,12 +1,12 @@
 #include "selection/door/ListPictures.h"
 
+#include "common/Background.h"
 #include "door/DoorDecoder.h"
 #include "door/HeaderOfFile.h"
 #include "door/Orientation.h"
 #include "door/PictureDraft.h"
 #include "imaging/files/PictureFile.h"
 
-#include <thread>
 #include <utility>
 
 namespace lumora {
@@ -47,14 +47,14 @@ void ListPictures::stop() {
 
 void ListPictures::read(const HostPath& path) {
     stop();
-    std::thread([ticket = m_desk.ticket(), path, program = m_doorProgram, rules = m_rules, cell = m_cell,
-                 stop = m_stop.get_token()] {
+    runInBackground([ticket = m_desk.ticket(), path, program = m_doorProgram, rules = m_rules, cell = m_cell,
+                     stop = m_stop.get_token()] {
         const Result<Bitmap> picture = listPicture(path, program, rules, cell, stop);
         ticket.handIn([picture, stop](ListPictures& list) {
             if (!stop.stop_requested())
                 Q_EMIT list.done(picture);
         });
-    }).detach();
+    });
 }
 
 } // namespace lumora

@@ -1,6 +1,7 @@
 #include "selection/door/PictureDoor.h"
 
 #include "common/AnsiCodePage.h"
+#include "common/Background.h"
 #include "common/HostFile.h"
 #include "common/PictureName.h"
 #include "common/Warning.h"
@@ -54,9 +55,7 @@ Result<qint64> makePicture(const DoorDecoder& decoder, const HostPath& source, c
 
 // Not the pool in which small pictures are drawn: a damaged file may hold its thread for half a minute.
 QThreadPool& decoders() {
-    // Never ended: that would wait for a read from a card that hangs.
-    static QThreadPool& pool = *new QThreadPool;
-    pool.setMaxThreadCount(madeAtOnce);
+    static QThreadPool& pool = backgroundPool(madeAtOnce);
     return pool;
 }
 

@@ -1,5 +1,6 @@
 #include "transfer/delivery/PrintPreviews.h"
 
+#include "common/Background.h"
 #include "order/OrderFolder.h"
 #include "order/PrintFileName.h"
 #include "platform/files/Files.h"
@@ -9,7 +10,6 @@
 #include <QImageReader>
 
 #include <algorithm>
-#include <thread>
 #include <utility>
 
 namespace lumora {
@@ -60,14 +60,14 @@ void PrintPreviews::read(const OrderFolder& folder, PrintFileShape shape) {
         return;
     m_folder = path;
     m_pictures.clear();
-    std::thread([ticket = m_desk.ticket(), path, shape, prints = firstPrints(m_files, folder)] {
+    runInBackground([ticket = m_desk.ticket(), path, shape, prints = firstPrints(m_files, folder)] {
         std::vector<Bitmap> pictures;
         for (const HostPath& print : prints) {
             if (Bitmap picture = previewOf(print, shape); !picture.isNull())
                 pictures.push_back(std::move(picture));
         }
         ticket.handIn([path, pictures](PrintPreviews& previews) { previews.settle(path, pictures); });
-    }).detach();
+    });
 }
 
 void PrintPreviews::settle(const QString& folder, const std::vector<Bitmap>& pictures) {
