@@ -28,6 +28,7 @@ namespace {
 
 constexpr int framesBehind = 2; // the first may be the button's own, as the page is drawn some milliseconds later
 constexpr double goal = 50;     // milliseconds
+constexpr int pause = 400;      // milliseconds between two lines; later frames are the next line's
 
 using ByPress = std::map<QString, std::vector<Times>>;
 
@@ -40,8 +41,8 @@ public:
         , m_times(times) {
         qApp->installEventFilter(this);
         connect(&program.chain(), &PageChain::shown, this, [this](Page* page) {
-            m_changed = true;
-            connect(page, &Page::changed, this, [this] { m_changed = true; });
+            change();
+            connect(page, &Page::changed, this, [this] { change(); });
         });
     }
     ~Frames() override { keep(); }
@@ -60,8 +61,10 @@ protected:
                    m_behind < framesBehind) {
             const bool changed = m_changed;
             watched->event(event);
-            if (const Times now = timeNow(); changed || m_took.wall == 0)
-                m_took = {now.wall - m_since.wall, 0, now.thread - m_since.thread};
+            const Times now = timeNow();
+            const double since = now.wall - m_since.wall;
+            if (m_took.wall == 0 || (changed && (m_behind == 0 || since < pause)))
+                m_took = {since, 0, now.thread - m_since.thread};
             m_behind += changed;
             return true;
         }
@@ -69,6 +72,7 @@ protected:
     }
 
 private:
+    void change() { m_changed = m_changed || timeNow().wall - m_since.wall < pause; }
     void keep() {
         if (!m_press.isEmpty() && m_took.wall > 0)
             m_times[m_press].push_back(m_took);
@@ -108,7 +112,8 @@ QByteArray choosing(const QString& scenario) {
     QByteArray lines;
     for (const QByteArray& line : whole.left(std::max(form, edited) + 1).split('\n')) {
         if (!line.startsWith("shot "))
-            lines += line + "\npause 250\n"; // what comes of a press is seen before the next
+            lines += line + "\npause "_ba + QByteArray::number(pause) +
+                     '\n'; // what comes of a press is seen before the next
     }
     return lines;
 }
