@@ -5,6 +5,7 @@
 #include "selection/FolderPager.h"
 #include "selection/OrderSpace.h"
 #include "selection/PictureChoice.h"
+#include "selection/PlaceNames.h"
 #include "selection/PrintQuality.h"
 #include "session/SessionState.h"
 #include "support/PageRig.h"
@@ -259,6 +260,9 @@ TEST(AChoice, carefullyShowsThePagesThatWereSeen) {
         EXPECT_EQ(at.choice.hasNextPage(), !c.careful || at.choice.path(c.count - 1) != u"C:\\p\\40.jpg"_s);
         const auto range = at.choice.range();
         EXPECT_EQ(range ? range->start + 1 : 7, c.first.toInt()) << c.careful << c.presses;
+        EXPECT_EQ(range ? range->count : 1, c.count) << c.careful << c.presses;
+        const int all = range && range->of == SeenPages::Of::Folders ? 40 : at.choice.basket().count();
+        EXPECT_EQ(range ? range->all : all, all) << c.careful << c.presses;
         const bool hasPrevious = at.choice.hasPreviousPage();
         at.choice.previousPage();
         EXPECT_EQ(hasPrevious, at.choice.path(0) != u"C:\\p\\"_s + c.first + u".jpg"_s) << c.careful << c.presses;
@@ -326,6 +330,16 @@ TEST(ACard, isOfferedInTheWordsOfItsLanguage) {
             EXPECT_EQ(words.opens, card && card->pictures > 0);
         }
     }
+}
+
+TEST(APlace, isToldFromAnotherOfItsKind) {
+    using enum Medium::Kind;
+    const std::vector<Cards::Card> cards = {{{{}, Stick, u"TOM"_s, "/m/a"}, {}}, {{{}, Stick, {}, "/m/b"}, {}}};
+    const std::vector<Place> places = {
+        {u"This computer"_s, {}, "/"}, placeOf("/m/a", cards, true), placeOf("/m/b", cards, true)};
+    EXPECT_EQ(whereIs("/m/a/DCIM", places), u"USB stick · \u2068TOM\u2069 \u203A \u2068DCIM\u2069"_s);
+    EXPECT_EQ(whereIs("/m/b", places), u"USB stick · \u2068b\u2069"_s);
+    EXPECT_EQ(whereIs("/m/bc", places), u"This computer \u203A \u2068m\u2069 \u203A \u2068bc\u2069"_s);
 }
 
 TEST(OrderSpace, IsReckonedByPaperOrPictureAndToldInFigures) {

@@ -5,6 +5,7 @@
 #include "selection/pictures/kyoskNew.h"
 #include "session/SessionState.h"
 #include "views/kit/FingerMoves.h"
+#include "views/window/DoubledPress.h"
 #include "views/window/MainWindow.h"
 
 #include <QApplication>
@@ -37,8 +38,10 @@ public:
     }
     enum class End { Lifted, Cancelled };
     void draw(QWidget& on, const std::vector<QPoint>& way, const std::vector<QPoint>& second = {},
-              End end = End::Lifted) {
+              End end = End::Lifted, bool isDoubled = false) {
         m_walk.settle();
+        if (isDoubled)
+            m_walk.program().window().presses().changed();
         auto hand = QTest::touchEvent(on.window(), m_device.get(), false);
         hand.press(0, way.front(), &on).commit();
         if (!second.empty())
@@ -153,6 +156,8 @@ TEST(Fingers, TurnThePagesOfPicturesAndChooseNothingOnTheWay) {
         draw(forwards);
         draw(-forwards);
         EXPECT_EQ(page.Picture1[1].text, first) << english;
+        fingers.draw(cell, {from, from + forwards / 2, from + forwards}, {}, Fingers::End::Lifted, true);
+        EXPECT_EQ(page.Picture1[1].text, first) << "a doubled press";
         EXPECT_EQ(page.List1.count(), 0);
         draw({10, 10});
         EXPECT_EQ(page.List1.count(), 1) << "a tap chooses";

@@ -45,14 +45,13 @@ void ListPictures::stop() {
     m_stop = std::stop_source();
 }
 
-void ListPictures::read(const HostPath& path) {
-    stop();
-    runInBackground([ticket = m_desk.ticket(), path, program = m_doorProgram, rules = m_rules, cell = m_cell,
+void ListPictures::read(int row, const HostPath& path) {
+    runInBackground([ticket = m_desk.ticket(), row, path, program = m_doorProgram, rules = m_rules, cell = m_cell,
                      stop = m_stop.get_token()] {
         const Result<Bitmap> picture = listPicture(path, program, rules, cell, stop);
-        ticket.handIn([picture, stop](ListPictures& list) {
+        ticket.handIn([row, picture, stop](ListPictures& list) {
             if (!stop.stop_requested())
-                Q_EMIT list.done(picture);
+                Q_EMIT list.done(row, picture);
         });
     });
 }

@@ -21,12 +21,16 @@ public:
     ListPictures(HostPath doorProgram, DoorRules rules, int cell);
     ~ListPictures() override;
 
-    // Reads this one. Of one that is still being read nothing is told any more.
-    void read(const HostPath& path);
+    // As many as a caller should have read at once.
+    static constexpr int atATime = 3;
+
+    // Reads this one, whatever is being read.
+    void read(int row, const HostPath& path);
+    // Of those that are still being read nothing is told any more.
     void stop();
 
 Q_SIGNALS:
-    void done(const lumora::Result<lumora::Bitmap>& picture);
+    void done(int row, const lumora::Result<lumora::Bitmap>& picture);
 
 private:
     const HostPath m_doorProgram;

@@ -141,6 +141,8 @@ public:
     // The box that takes the keyboard next; a view moves the focus when the number has changed.
     const QString& focusBox() const { return m_focusBox; }
     int focusRequest() const { return m_focusRequest; }
+    // The folder picked last.
+    QString folderName() const;
     // Combo1 shows its prompt, and what is typed takes its place.
     bool promptStands() const { return m_promptStands; }
 

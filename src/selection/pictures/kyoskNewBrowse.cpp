@@ -17,6 +17,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace lumora {
 
@@ -32,19 +33,22 @@ HostPath kyoskNew::hostOf(const DrivePath& path) const {
 }
 
 void kyoskNew::setCellPixels(int pixels, int large) {
-    m_largeScale = large / 400.0;
-    if (pixels < 1 || pixels == m_cellPixels)
+    const bool largeGrew = std::exchange(m_largeScale, large / 400.0) < large / 400.0;
+    const bool cellsChanged = pixels >= 1 && std::exchange(m_cellPixels, pixels) != pixels;
+    if (!largeGrew && !cellsChanged)
         return;
-    m_cellPixels = pixels;
     // A view may call this while it renders. Drawing pumps events, so it waits for the next turn of the event loop.
     QMetaObject::invokeMethod(
         this,
-        [this] {
+        [this, cellsChanged] {
             if (m_handedOver)
                 return;
             if (!Picture2.bitmap.isNull())
                 showLarge(m_largePath);
-            drawCells();
+            if (cellsChanged)
+                drawCells();
+            else
+                Q_EMIT changed();
         },
         Qt::QueuedConnection);
 }

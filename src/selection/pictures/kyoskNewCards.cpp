@@ -3,6 +3,7 @@
 #include "platform/Machine.h"
 #include "platform/Platform.h"
 #include "selection/CardWords.h"
+#include "selection/PlaceNames.h"
 #include "selection/pictures/kyoskNew.h"
 #include "session/SessionState.h"
 
@@ -52,6 +53,18 @@ void kyoskNew::showCards() {
     cardOffer.text = words.head;
     cardNote.text = words.note;
     showCopies();
+}
+
+// As in the picker, whose places customers know.
+QString kyoskNew::folderName() const {
+    const DrivePath folder(Label29.text.trimmed());
+    if (!folder.leaf().isEmpty())
+        return folder.leaf();
+    for (const Drives::Drive& drive : m_platform.files.drives().drives()) {
+        if (drive.removable && folder.text().startsWith(drive.letter))
+            return placeOf(drive.folder, m_platform.cards.all(), m_state.english()).words;
+    }
+    return folder.text();
 }
 
 void kyoskNew::openCard() {

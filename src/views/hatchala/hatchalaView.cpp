@@ -1,7 +1,7 @@
 #include "views/hatchala/hatchalaView.h"
 
 #include "views/hatchala/StartDecoration.h"
-#include "views/kit/DigitGrid.h"
+#include "views/kit/KeyRows.h"
 #include "views/kit/Overlay.h"
 
 #include <QEvent>
@@ -162,12 +162,13 @@ void hatchalaView::makeShops() {
 
 // On a kiosk the customer of the order is known by them.
 QWidget* hatchalaView::makeDigits() {
-    std::array<QPushButton*, 10> digits{};
-    for (int i = 0; i < 10; ++i)
-        digits[static_cast<std::size_t>(i)] =
-            button(c.Command4Sifra[static_cast<std::size_t>(i)], Role::Secondary, &hatchala::Command4Sifra_Click, i);
-    m_takeBack = button(c.Command4Mehak, Role::Secondary, &hatchala::Command4Mehak_Click, u"backspace"_s);
-    QWidget* pad = inMiddle(leftToRight(digitGrid(theme(), digits, m_takeBack)), 2);
+    KeyRows keys;
+    for (std::size_t i = 0; i < keys.digits.size(); ++i)
+        keys.digits[i] = toKey(
+            button(c.Command4Sifra[i], Role::Plain, &hatchala::Command4Sifra_Click, static_cast<int>(i)), theme());
+    m_takeBack = toKey(button(c.Command4Mehak, Role::Plain, &hatchala::Command4Mehak_Click, u"backspace"_s), theme());
+    keys.besideZero[1] = m_takeBack;
+    QWidget* pad = inMiddle(inDigitRows(*this, theme(), keys), 2);
     follow(pad, c.Label4Sfarot);
     return pad;
 }

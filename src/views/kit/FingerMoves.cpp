@@ -73,8 +73,9 @@ SwipeBox::SwipeBox(QLayout* inside, std::function<void(Swipe::Way)> swiped)
     setLayout(inside);
 }
 
-FingerMoves::FingerMoves(QObject* parent)
-    : QObject(parent) {
+FingerMoves::FingerMoves(QObject* parent, std::function<bool()> isRefused)
+    : QObject(parent)
+    , m_isRefused(std::move(isRefused)) {
     qApp->installEventFilter(this);
     m_rests.setSingleShot(true);
     m_rests.setInterval(restsAfter);
@@ -196,6 +197,8 @@ void FingerMoves::sendPress() {
 // The press is taken back from what has it.
 void FingerMoves::begin(Way way) {
     const bool pressed = m_way == Way::Open && !m_waits;
+    if (m_isRefused && m_isRefused())
+        m_swipe.reset();
     if (m_area && way != Way::Scrolls)
         QScroller::scroller(m_area->viewport())->stop();
     m_way = way;

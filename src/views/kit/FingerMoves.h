@@ -51,7 +51,8 @@ public:
 class FingerMoves : public QObject {
     Q_OBJECT
 public:
-    explicit FingerMoves(QObject* parent);
+    // isRefused: whether the press in hand does not count. Nothing is swiped by it.
+    explicit FingerMoves(QObject* parent, std::function<bool()> isRefused = {});
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -73,6 +74,7 @@ private:
     void forget(Way way);
     void tell() const;
 
+    const std::function<bool()> m_isRefused;
     Way m_way = Way::None;
     QPointer<QWidget> m_widget; // that was pressed
     QPointer<QAbstractScrollArea> m_area;

@@ -7,6 +7,7 @@
 #include <QPainterPath>
 
 #include <algorithm>
+#include <utility>
 
 namespace lumora {
 
@@ -65,9 +66,11 @@ int PictureCell::nameHeight() const {
     return QFontMetrics(theme().font(Theme::Type::Small)).height() + theme().size(Space::Small);
 }
 
-// Scaled once, and not at each painting.
+// Scaled once for a picture in a room, however often it is shown and painted.
 void PictureCell::fitPicture() {
     const QSize room = pictureRoom().size() * devicePixelRatioF();
+    if (const std::pair from(m_look.picture.cacheKey(), room); std::exchange(m_fittedFrom, from) == from)
+        return;
     const QSize size = m_look.picture.size();
     const bool fits = size.width() <= room.width() && size.height() <= room.height();
     if (m_look.picture.isNull() || room.isEmpty()) {

@@ -53,7 +53,8 @@ private:
     void fitPicture();
 
     Look m_look;
-    QImage m_fitted; // in pixels of the screen
+    QImage m_fitted;                       // in pixels of the screen
+    std::pair<qint64, QSize> m_fittedFrom; // the picture's key and the room
     QWidget* m_strip;
     QPushButton* m_minus;
     QPushButton* m_copies;

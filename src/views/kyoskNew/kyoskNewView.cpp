@@ -154,6 +154,7 @@ QWidget* kyoskNewView::makeSide() {
     connect(m_card, &QAbstractButton::clicked, &m_page, &kyoskNew::cardOffer_Click);
     m_large = new LargePicture(theme(), this);
     bindName(m_large, c.Picture2);
+    connect(m_large, &LargePicture::resized, this, [this] { QTimer::singleShot(0, this, &kyoskNewView::fitCells); });
     connect(m_large, &LargePicture::clicked, &m_page, &kyoskNew::Picture2_Click);
     const Card picture = makeCard("card", Pad::Slim);
     QPushButton* turn = button(c.Image4, Role::Plain, &kyoskNew::Image4_Click, u"rotate"_s);
@@ -383,11 +384,9 @@ void kyoskNewView::takeFocus() {
 }
 
 void kyoskNewView::renderFolder() {
-    const QString folder = c.Label29.text.trimmed();
-    const QString leaf = DrivePath(folder).leaf();
-    const QString name = leaf.isEmpty() ? folder : leaf; // as in the picker, whose places customers know
+    const QString name = m_page.folderName();
     QString line;
-    if (!folder.isEmpty())
+    if (!name.isEmpty())
         line = fromLeft(m_folder->fontMetrics().elidedText(name, Qt::ElideMiddle, theme().size(Extent::WideField))) +
                u"  ·  "_s + c.pictureCount.text;
     m_folder->setText(line);

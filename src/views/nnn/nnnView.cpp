@@ -20,9 +20,9 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// A text that is no size is drawn as a square.
+// Empty for a text that is no size.
 QSizeF lyingPaper(const QString& text) {
-    const PaperSize sides = PaperSize::ofText(text.trimmed()).value_or(PaperSize{10, 10});
+    const PaperSize sides = PaperSize::ofText(text.trimmed()).value_or(PaperSize());
     return QSizeF(std::max(sides.shortSide, sides.longSide), std::min(sides.shortSide, sides.longSide));
 }
 
@@ -116,7 +116,8 @@ QWidget* nnnView::makeOptions() {
             QSizeF largest;
             for (const CheckCaption& size : c.Option1)
                 largest = size.visible ? largest.expandedTo(lyingPaper(size.text)) : largest;
-            drawPaperBesideHand(painter, place, lyingPaper(c.Option1[i].text), largest);
+            if (const QSizeF own = lyingPaper(c.Option1[i].text); !own.isEmpty())
+                drawPaperBesideHand(painter, place, own, largest);
         };
         auto* card = new DrawingCard(theme(), this, paper, {190, 200}, DrawingCard::Words::Size);
         m_sizes[i] = card;

@@ -36,7 +36,8 @@ MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     setStyleSheet(m_theme->styleSheet());
     new FocusRing(*m_theme, this);
     new TouchPointer(this);
-    new FingerMoves(this); // behind the other filters, which are asked later then
+    new FingerMoves(this,
+                    [this] { return m_presses->refuses(); }); // behind the other filters, which are asked later then
     connect(&chain, &PageChain::shown, this, &MainWindow::pageShown);
     connect(&chain, &PageChain::unloaded, this, &MainWindow::pageUnloaded);
 }

@@ -23,7 +23,7 @@
 #include <QStyledItemDelegate>
 
 #include <algorithm>
-#include <cstdlib>
+#include <utility>
 
 namespace lumora {
 
@@ -132,15 +132,9 @@ QString leafOf(const HostPath& path) {
     return toText(path.filename());
 }
 
-// A text without the room for one line has two, broken at the blank nearest to its middle. Each stands off from a sign.
-QString inLines(QString text, const QFontMetrics& metrics, int room) {
-    const auto away = [&](qsizetype at) { return std::abs(2 * at - text.size()); };
-    qsizetype blank = -1;
-    for (qsizetype at = text.indexOf(u' '); at >= 0; at = text.indexOf(u' ', at + 1))
-        blank = blank < 0 || away(at) < away(blank) ? at : blank;
-    if (blank >= 0 && metrics.horizontalAdvance(text) > room)
-        text[blank] = u'\n';
-    QStringList lines = text.split(u'\n');
+// A text without the room for one line has two. Each stands off from a sign.
+QString inLines(const QString& text, const QFontMetrics& metrics, int room) {
+    QStringList lines = metrics.horizontalAdvance(text) > room ? inTwoLines(text) : QStringList(text);
     for (QString& line : lines)
         line = QChar(0xA0) + metrics.elidedText(line, Qt::ElideRight, room);
     return lines.join(u'\n');
@@ -233,65 +227,29 @@ void PicturePicker::addPlaceButton(std::size_t i) {
 void PicturePicker::joinPlaces(const std::vector<Cards::Card>& cards) {
     for (Place& place : m_places) {
         if (!place.label.isEmpty()) // its kind may be known by now
-            place = placeOf(place.folder);
+            place = placeOf(place.folder, m_cards.all(), m_state.english());
     }
     for (const Cards::Card& card : cards) {
         const HostPath& folder = card.medium.folder;
         const auto isIt = [&](const Place& place) { return place.folder == folder; };
         if (!card.summary || !isOpenTo(folder) || std::any_of(m_places.begin(), m_places.end(), isIt))
             continue;
-        m_places.push_back(placeOf(folder));
+        m_places.push_back(placeOf(folder, cards, m_state.english()));
         addPlaceButton(m_places.size() - 1);
     }
     showPlaceNames();
-    m_where->setWhole(wordsOf(m_folder));
-}
-
-PicturePicker::Place PicturePicker::placeOf(const HostPath& medium) const {
-    Medium known;
-    known.label = toText(medium.filename());
-    for (const Cards::Card& card : m_cards.all()) {
-        if (card.medium.folder == medium)
-            known.kind = card.medium.kind;
-    }
-    return {mediumWords({{}, known.kind, {}, {}}, m_state.english()), u"card"_s, medium, known.label};
-}
-
-// Two of a kind are told apart by what their owner or their camera has named them.
-QString PicturePicker::nameOf(const Place& place) const {
-    const auto isOfItsKind = [&](const Place& other) { return other.words == place.words; };
-    return std::count_if(m_places.begin(), m_places.end(), isOfItsKind) > 1 ? withLabel(place.words, place.label)
-                                                                            : place.words;
+    m_where->setWhole(whereIs(m_folder, m_places));
 }
 
 void PicturePicker::showPlaceNames() {
     for (std::size_t i = 0; i < m_placeButtons.size(); ++i) {
         QPushButton* button = m_placeButtons[i];
-        const QString name = nameOf(m_places[i]);
+        const QString name = nameOf(m_places[i], m_places);
         button->ensurePolished();
         const int room = m_theme.size(Extent::WideField) - m_theme.px(56); // beside its sign
         button->setText(inLines(name, button->fontMetrics(), room).replace(u'&', u"&&"_s));
         button->setAccessibleName(name);
     }
-}
-
-// The place that is nearest above, and the folders below it.
-QString PicturePicker::wordsOf(const HostPath& folder) const {
-    const Place* nearest = nullptr;
-    const auto isIn = [&](const HostPath& place) {
-        return std::mismatch(place.begin(), place.end(), folder.begin(), folder.end()).first == place.end();
-    };
-    for (const Place& place : m_places) {
-        if (isIn(place.folder) && (!nearest || place.folder.native().size() > nearest->folder.native().size()))
-            nearest = &place;
-    }
-    if (!nearest)
-        return toText(folder);
-    QString words = nameOf(*nearest);
-    for (auto at = std::mismatch(nearest->folder.begin(), nearest->folder.end(), folder.begin(), folder.end()).second;
-         at != folder.end(); ++at)
-        words += u" \u203A \u2068"_s + toText(*at) + QChar(0x2069);
-    return words;
 }
 
 QPushButton* PicturePicker::wordButton(const QString& name, const char* role, const QString& text,
@@ -424,7 +382,7 @@ void PicturePicker::openCard(std::size_t slot) {
         Q_EMIT finished(pathText(m_cardSlots[slot].picture));
 }
 
-std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initialFolder) const {
+std::vector<Place> PicturePicker::places(const DrivePath& initialFolder) const {
     std::vector<Place> result;
     const auto addPlace = [&](const Place& place) {
         std::error_code error;
@@ -439,7 +397,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initial
     const QString ofProgram = m_state.wording(u"תיקיית התוכנה"_s, u"The program's folder"_s);
     const auto addDrive = [&](const Drives::Drive& drive) {
         if (drive.removable)
-            addPlace(placeOf(drive.folder));
+            addPlace(placeOf(drive.folder, m_cards.all(), m_state.english()));
         else
             add(drive.folder == "/" ? m_state.wording(u"כל המחשב"_s, u"This computer"_s) : ofProgram, u"drive"_s,
                 drive.folder);
@@ -476,6 +434,7 @@ std::vector<PicturePicker::Place> PicturePicker::places(const DrivePath& initial
 void PicturePicker::open(const HostPath& folder) {
     m_folder = folder;
     m_pictures.stop();
+    m_inHand = 0;
     m_unread.clear();
     m_grid->clear();
     m_take->setEnabled(false);
@@ -486,7 +445,7 @@ void PicturePicker::open(const HostPath& folder) {
         if (m_places[i].folder == folder)
             m_placeButtons[i]->setChecked(true);
     }
-    m_where->setWhole(wordsOf(folder));
+    m_where->setWhole(whereIs(folder, m_places));
 
     std::vector<HostPath> folders;
     std::vector<HostPath> files;
@@ -568,38 +527,51 @@ void PicturePicker::addByDays(const std::vector<HostPath>& files) {
     }
 }
 
+// Some at a time, so that a slow one does not hold those behind it.
 void PicturePicker::readNext() {
-    if (m_unread.empty())
-        return;
-    // The rows in view are read first.
-    auto next = m_unread.begin();
+    while (m_inHand < ListPictures::atATime && !m_unread.empty()) {
+        const auto next = nextUnread();
+        const int row = *next;
+        m_unread.erase(next);
+        ++m_inHand;
+        m_pictures.read(row, HostPath(m_grid->item(row)->data(PathRole).toByteArray().toStdString()));
+    }
+}
+
+// The rows in view are read first.
+std::deque<int>::const_iterator PicturePicker::nextUnread() const {
     const QRect seen = m_grid->viewport()->rect();
     for (auto at = m_unread.begin(); at != m_unread.end(); ++at) {
         const QRect cell = m_grid->visualItemRect(m_grid->item(*at));
-        if (cell.intersects(seen)) {
-            next = at;
-            break;
-        }
+        if (cell.intersects(seen))
+            return at;
         if (cell.top() > seen.bottom())
             break;
     }
-    m_reading = *next;
-    m_unread.erase(next);
-    m_pictures.read(HostPath(m_grid->item(m_reading)->data(PathRole).toByteArray().toStdString()));
+    return m_unread.begin();
 }
 
-void PicturePicker::showPicture(const Result<Bitmap>& picture) {
-    QListWidgetItem* item = m_grid->item(m_reading);
-    if (picture) {
+void PicturePicker::showPicture(int row, const Result<Bitmap>& picture) {
+    --m_inHand;
+    QListWidgetItem* item = m_grid->item(row);
+    if (picture)
         item->setData(PictureRole, picture->image());
-    } else {
-        writeWarning(picture.failure().message);
-        const HostPath file(item->data(PathRole).toByteArray().toStdString());
-        const QString words = failureWords(m_state, picture.failure(), DrivePath(pathText(file)));
-        item->setData(BrokenRole, words);
-        item->setData(Qt::AccessibleTextRole, QString(item->text() + u", "_s + words));
-    }
+    else
+        showUnread(*item, picture.failure());
     readNext();
+}
+
+// Where the machine lacks a program the picture may be as good as any, and can be chosen.
+void PicturePicker::showUnread(QListWidgetItem& item, const Failure& why) {
+    if (why.kind == Failure::Kind::NoProgram) {
+        if (!std::exchange(m_toldStaff, true))
+            writeWarning(why.message);
+        return;
+    }
+    const HostPath file(item.data(PathRole).toByteArray().toStdString());
+    const QString words = warnedWords(m_state, why, DrivePath(pathText(file)));
+    item.setData(BrokenRole, words);
+    item.setData(Qt::AccessibleTextRole, QString(item.text() + u", "_s + words));
 }
 
 void PicturePicker::activate(const QListWidgetItem* item) {

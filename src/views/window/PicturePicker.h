@@ -4,6 +4,7 @@
 #include "platform/files/CustomersMedia.h"
 #include "platform/files/HostPath.h"
 #include "platform/media/Cards.h"
+#include "selection/PlaceNames.h"
 #include "selection/door/ListPictures.h"
 #include "views/kit/Overlay.h"
 
@@ -24,8 +25,8 @@ struct Platform;
 struct SessionState;
 
 // The picker of one picture: the places at the side, memory cards first, and a grid of the folders and pictures of the
-// place that is open. A click chooses, a double click or Enter takes it. Small pictures are read in the background, one
-// after another, those in view first, so that a folder of thousands opens at once. Where every file is on offer, other
+// place that is open. A click chooses, a double click or Enter takes it. Small pictures are read in the background,
+// some at a time, those in view first, so that a folder of thousands opens at once. Where every file is on offer, other
 // files show by a sign. Where the lab has cards watched, those that are in stand above, and pictures stand by days.
 class PicturePicker : public Overlay {
     Q_OBJECT
@@ -39,12 +40,6 @@ Q_SIGNALS:
     void finished(const QString& drivePath);
 
 private:
-    struct Place {
-        QString words; // as customers say it
-        QString icon;
-        HostPath folder;
-        QString label = {}; // of a medium; tells it from another of its kind
-    };
     bool everyFile() const { return m_offer == Dialogs::Offer::EveryFile; }
     std::vector<Place> places(const DrivePath& initialFolder) const;
     // On a kiosk a customer sees cards and sticks alone; one that came since is among them.
@@ -60,10 +55,7 @@ private:
     void addByDays(const std::vector<HostPath>& files);
     QLayout* makePlaces();
     void addPlaceButton(std::size_t place);
-    Place placeOf(const HostPath& medium) const;
-    QString nameOf(const Place& place) const;
     void showPlaceNames();
-    QString wordsOf(const HostPath& folder) const;
     void joinPlaces(const std::vector<Cards::Card>& cards);
     void makeGrid();
     QPushButton* wordButton(const QString& name, const char* role, const QString& text,
@@ -72,7 +64,9 @@ private:
     void activate(const QListWidgetItem* item);
     void take();
     void readNext();
-    void showPicture(const Result<Bitmap>& picture);
+    std::deque<int>::const_iterator nextUnread() const;
+    void showUnread(QListWidgetItem& item, const Failure& why);
+    void showPicture(int row, const Result<Bitmap>& picture);
     bool isPicture(const HostPath& path) const;
     QString pathText(const HostPath& path) const;
 
@@ -100,7 +94,8 @@ private:
     QPushButton* m_take;
     QListWidget* m_grid;
     ListPictures m_pictures;
-    int m_reading = -1;       // the row whose small picture is being read
+    int m_inHand = 0;         // small pictures that are being read
+    bool m_toldStaff = false; // that the program is missing which reads them
     std::deque<int> m_unread; // rows whose small picture is still to be read
 };
 

@@ -16,6 +16,8 @@ public:
     explicit PressFilter(QWidget* window);
 
     DoubledPress rule;
+    // The press of a mouse or a finger that is down does not count.
+    bool refuses() const { return m_mouseTaken; }
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;

@@ -2,7 +2,7 @@
 
 #include "kiosk/StaffCode.h"
 #include "session/SessionState.h"
-#include "views/kit/DigitGrid.h"
+#include "views/kit/KeyRows.h"
 
 #include <QKeyEvent>
 #include <QTimer>
@@ -31,17 +31,17 @@ StaffPanel::StaffPanel(const Theme& theme, QWidget* parent, const SessionState& 
     setAccessibleName(title);
     m_dots->setObjectName(u"staffDots"_s);
     m_words->setObjectName(u"staffWords"_s);
-    std::array<QPushButton*, 10> digits{};
-    for (int i = 0; i < 10; ++i) {
+    KeyRows keys;
+    for (std::size_t i = 0; i < keys.digits.size(); ++i) {
         const QString digit = QString::number(i);
-        digits[static_cast<std::size_t>(i)] =
-            named(plainButton(u"staffDigit(%1)"_s.arg(i), "secondary", [this, digit] { type(digit); }), digit);
+        keys.digits[i] = toKey(
+            named(plainButton(u"staffDigit(%1)"_s.arg(i), "plain", [this, digit] { type(digit); }), digit), theme);
     }
-    QPushButton* back = plainButton(u"staffTakeBack"_s, "secondary", [this] { takeBack(); });
+    QPushButton* back = toKey(plainButton(u"staffTakeBack"_s, "plain", [this] { takeBack(); }), theme);
+    keys.besideZero[1] = back;
     back->setAccessibleName(state.wording(u"מחק ספרה", u"Take back a digit"));
     setButtonIcon(back, theme, u"backspace"_s, Theme::Colour::Ink);
-    add(*column(),
-        {centred(words("large", title)), m_dots, m_words, inMiddle(leftToRight(digitGrid(theme, digits, back)), 2)});
+    add(*column(), {centred(words("large", title)), m_dots, m_words, inMiddle(inDigitRows(*this, theme, keys), 2)});
     QPushButton* cancel = named(plainButton(u"staffCancel"_s, "secondary", [this] { Q_EMIT closed(); }),
                                 state.wording(u"ביטול", u"Cancel"));
     m_enter = named(plainButton(u"staffEnter"_s, "main", [this] { give(); }), state.wording(u"כניסה", u"Enter"));
