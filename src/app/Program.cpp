@@ -26,6 +26,7 @@
 #include "session/lab/LabFile.h"
 #include "station/KeptLog.h"
 #include "transfer/waiting/WaitingSending.h"
+#include "views/window/Application.h"
 #include "views/window/KioskPanels.h"
 #include "views/window/MainWindow.h"
 #include "views/window/ScreenDialogs.h"
@@ -155,6 +156,7 @@ Result<void> Program::start() {
     writeLog(u"start: lumora %1, Qt %2"_s.arg(QStringLiteral(LUMORA_VERSION), QString::fromLatin1(qVersion())));
     if (!reading.errors.isEmpty())
         return Failure{Failure::Kind::Damaged, reading.errors.join(u'\n')};
+    Application::setContrast(reading.deployment.contrast);
     if (m_options.operatorArea)
         reading.deployment.OperatorArea = true;
 

@@ -39,7 +39,8 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
-              "[Operator]\nArea = no\nEditor = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting = yes\nKeyboard = Auto\n"
+              "[Operator]\nArea = no\nEditor = yes\n[Look]\nContrast = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting "
+              "= yes\nKeyboard = Auto\n"
               "Mode = yes\nIdleSeconds = 3600\nKeepDays = 7\nKeepLogDays = 9999\nPrinter = slips\n[Log]\nKeep = yes\n"
               "[Shops]\nShop2Phone = 03-5\n"
               "[Branches]\nBranch10 = North\nBranch10Address2 = 2nd floor\n"
@@ -59,7 +60,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
     EXPECT_TRUE(lab.SugTzad == 60 && lab.ftpType == FtpType::Image && lab.HaKoopon == 1 && lab.MinuyPaar == 2);
     EXPECT_TRUE(lab.Waiting && state.Waiting && lab.watchedCards && lab.keptFtpSession && !lab.DchisatAlbum &&
                 lab.SplitPage && lab.FitMuzag && lab.DoarReshut && lab.TachanaMekomit && !lab.OperatorArea &&
-                lab.OperatorEditor && lab.KeepLog && state.screenKeys == ScreenKeys::Touches);
+                lab.OperatorEditor && lab.contrast && lab.KeepLog && state.screenKeys == ScreenKeys::Touches);
     EXPECT_TRUE(lab.GvulMuzag == 0 && lab.TmunatPaar == 1 && profile.ReportOn == 0 && lab.MediniyutDchisa == 1);
     EXPECT_TRUE(state.kiosk == (KioskRules{true, 3600, {}, 7, 9999, u"slips"_s}));
     const MailAccount& mail = lab.profile.mail;

@@ -22,14 +22,17 @@ inline void PrintTo(const Screen& screen, std::ostream* out) {
 
 // Each page in each state, in both languages, on a small, a wide and a tall screen: looked at for what a person could
 // stumble over, and photographed where LUMORA_SHOTS asks for it. LUMORA_SCREENS=all brings the smallest and the largest
-// screen, and each in both languages.
+// screen, and each in both languages; one of contrast stands among them.
 class PageLook : public ::testing::TestWithParam<Screen> {
 public:
     static auto screens() {
-        std::vector<Screen> all = {
-            {{1024, 768}, false}, {{1024, 768}, true}, {{1920, 1080}, false}, {{1080, 1920}, true}};
+        std::vector<Screen> all = {{{1024, 768}, false},
+                                   {{1024, 768}, true},
+                                   {{1920, 1080}, false},
+                                   {{1080, 1920}, true},
+                                   {{1024, 768}, false, true}};
         if (qEnvironmentVariable("LUMORA_SCREENS") == u"all") {
-            all.insert(all.end(), {{{1920, 1080}, true}, {{1080, 1920}, false}});
+            all.insert(all.end(), {{{1920, 1080}, true}, {{1080, 1920}, false}, {{1024, 768}, true, true}});
             for (const QSize& size : {QSize(800, 600), QSize(3840, 2160)})
                 all.insert(all.end(), {{size, false}, {size, true}});
         }
@@ -38,13 +41,14 @@ public:
     static std::string nameOf(const ::testing::TestParamInfo<Screen>& info) {
         const QSize size = info.param.size;
         return std::to_string(size.width()) + "x" + std::to_string(size.height()) +
-               (info.param.english ? "English" : "Hebrew");
+               (info.param.english ? "English" : "Hebrew") + (info.param.contrast ? "Contrast" : "");
     }
 
 protected:
     void look(Walk& walk, const QString& name) {
         walk.settle(60);
-        walk.shot(u"%1-%2"_s.arg(name, GetParam().english ? u"en" : u"he"));
+        walk.shot(u"%1-%2%3"_s.arg(name, GetParam().english ? u"en" : u"he",
+                                   GetParam().contrast ? u"-contrast"_s : QString()));
         for (const QString& fault : walk.faults())
             ADD_FAILURE() << qPrintable(name) << ": " << qPrintable(fault);
     }

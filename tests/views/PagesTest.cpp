@@ -14,6 +14,9 @@
 #include <QTest>
 #include <QTimer>
 
+#include <algorithm>
+#include <cmath>
+
 namespace lumora {
 
 TEST(CarefulProgram, HoldsItsDataFolderAlone) {
@@ -40,8 +43,38 @@ TEST(Words, KeepTheDirectionOfCodesAndLoseTheBlanksAtTheEndsOfLines) {
     }
 }
 
+// WCAG 2's contrast of two colours.
+static double contrastOf(const QColor& one, const QColor& other) {
+    const auto luminance = [](const QColor& colour) {
+        const auto linear = [](double part) {
+            return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+        };
+        return 0.2126 * linear(colour.redF()) + 0.7152 * linear(colour.greenF()) + 0.0722 * linear(colour.blueF());
+    };
+    const auto [darker, lighter] = std::minmax({luminance(one), luminance(other)});
+    return (lighter + 0.05) / (darker + 0.05);
+}
+
+TEST(ContrastLook, KeepsEachTextAtSevenToOneAndEachEdgeAtThree) {
+    using C = Theme::Colour;
+    Theme::setLook(Theme::Look::Contrast);
+    for (const QColor& ground : {C::Paper, C::Surface, C::Sunken, C::PrimarySoft, C::SunSoft, C::DangerSoft,
+                                 C::GoodSoft, C::SkySoft, C::VioletSoft, C::Here}) {
+        for (const QColor& text : {C::Ink, C::Muted, C::Primary, C::PrimaryDark, C::Danger, C::Good})
+            EXPECT_GE(contrastOf(text, ground), 7) << qPrintable(text.name() + u" on "_s + ground.name());
+        for (const QColor& edge : {C::Line, C::Edge, C::SunEdge, C::Focus})
+            EXPECT_GE(contrastOf(edge, ground), 3) << qPrintable(edge.name() + u" on "_s + ground.name());
+    }
+    for (const QColor& ground : {C::Primary, C::PrimaryDark, C::Ink, C::Danger, C::Good})
+        EXPECT_GE(contrastOf(Qt::white, ground), 7) << qPrintable(ground.name());
+    EXPECT_GE(contrastOf(C::Ink, C::Sun), 7);
+    EXPECT_GE(contrastOf(C::Ink, C::Marker), 7);
+    Theme::setLook(Theme::Look::Calm);
+}
+
 TEST_P(PageLook, HasNoFaultFromTheStartToTheTerms) {
     Walk walk(GetParam(), u"[Guards]\nCareful = yes\n"_s);
+    EXPECT_EQ(Theme::Colour::Ink == Qt::black, GetParam().contrast);
     go(walk, u":01-start "_s + toMenu + u":02-menu Command14 :03-clean Command9 Command15>Havharot :04-notice "_s);
     go(walk, u"Command1>nnn Image1(0) :05-details Command10 :06-message ! Text2=Dana Text3=+1-212-555-01234"_s);
     lookAtPicker(walk, u"nnn"_s, u"Command12"_s, u"06-long-telephone"_s, u"messageNo"_s);

@@ -51,7 +51,7 @@ class StartLook : public PageLook {};
 } // namespace
 
 TEST_P(StartLook, HasNoFaultInAnyOfItsStates) {
-    Walk walk(Screen{GetParam().size, false}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
+    Walk walk(Screen{GetParam().size, false, GetParam().contrast}, u"[Switches]\nDeliveryQuestion = yes\n"_s);
     // An advertising picture that the lab's installation has placed.
     const HostPath folder =
         *walk.program().platform().files.drives().toHost(walk.program().state().DiskRoot / u"lumora\\zmany");

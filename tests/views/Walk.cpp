@@ -81,7 +81,8 @@ Walk::Walk(QSize size, const QString& labSettings, Internet* line, Cards::Source
 }
 
 Walk::Walk(const Screen& screen, const QString& labSettings, Internet* line, Cards::Source media)
-    : Walk(screen.size, labSettings, line, std::move(media)) {
+    : Walk(screen.size, labSettings + (screen.contrast ? u"[Look]\nContrast = yes\n"_s : QString()), line,
+           std::move(media)) {
     if (screen.english)
         press(u"hatchala"_s, u"Check1"_s);
 }

@@ -27,6 +27,7 @@ QString focusName();
 struct Screen {
     QSize size;
     bool english;
+    bool contrast = false; // [Look] Contrast of the lab's file
 };
 
 // Parts of a route, from the start page on.

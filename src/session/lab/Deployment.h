@@ -36,8 +36,9 @@ struct Deployment {
     bool watchedCards = false; // cards and sticks show themselves; else they are found by looking
     bool OperatorArea = true;
     bool OperatorEditor = false;
-    bool Waiting = false; // orders that did not arrive are sent by themselves while nobody is at the start page
-    bool KeepLog = false; // steps, codes and times, for those who look after the station
+    bool contrast = false; // pages in black on white with strong edges
+    bool Waiting = false;  // orders that did not arrive are sent by themselves while nobody is at the start page
+    bool KeepLog = false;  // steps, codes and times, for those who look after the station
     ScreenKeys screenKeys = ScreenKeys::Never;
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;

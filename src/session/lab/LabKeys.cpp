@@ -255,6 +255,8 @@ std::vector<Row> rows() {
         {"Operator", "Area", yesNo(at(&D::OperatorArea), true, false)},
         {"Operator", "Editor", yesNo(at(&D::OperatorEditor), true, false)},
 
+        {"Look", "Contrast", yesNo(at(&D::contrast), true, false)},
+
         {"Kiosk", "Waiting", yesNo(at(&D::Waiting), true, false)},
         {"Kiosk", "Keyboard",
          words<ScreenKeys>(

@@ -32,13 +32,13 @@ QSize CardButton::minimumSizeHint() const {
 
 void CardButton::paintEvent(QPaintEvent*) {
     QPainter painter(this);
-    const double thick = isChecked() ? m_theme.thick() : underMouse() && isEnabled() ? m_theme.hair() : 1;
+    const double thick = isChecked() ? m_theme.thick() : underMouse() && isEnabled() ? m_theme.hair() : m_theme.edge();
     const bool lively = isEnabled() && (underMouse() || isDown());
     const QRectF card = drawCard(painter, rect(), isChecked() || lively ? Theme::Colour::Primary : Theme::Colour::Line,
                                  !isEnabled()              ? Theme::Colour::Sunken
                                  : isChecked() || isDown() ? Theme::Colour::PrimarySoft
                                                            : Theme::Colour::Surface,
-                                 thick, m_theme.size(Space::Wide));
+                                 thick, m_theme.size(Space::Wide), m_theme.edgeStyle(isEnabled()));
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
     painter.setLayoutDirection(layoutDirection());
     const int inset = m_theme.gap();

@@ -46,13 +46,13 @@ void Gauge::paintEvent(QPaintEvent*) {
     const double side = std::min(width(), height()) - thick - 2;
     QRectF ring(0, 0, side, side);
     ring.moveCenter(QRectF(rect()).center());
-    static const std::pair<QColor, QString> looks[] = {{Theme::Colour::Primary, {}}, // by Mood
-                                                       {Theme::Colour::Edge, u"pause"_s},
-                                                       {Theme::Colour::Sun, u"info"_s},
-                                                       {Theme::Colour::Good, u"tick"_s},
-                                                       {Theme::Colour::Danger, u"warning"_s}};
+    const std::pair<QColor, QString> looks[] = {{Theme::Colour::Primary, {}}, // by Mood
+                                                {Theme::Colour::Edge, u"pause"_s},
+                                                {Theme::Colour::SunEdge, u"info"_s},
+                                                {Theme::Colour::Good, u"tick"_s},
+                                                {Theme::Colour::Danger, u"warning"_s}};
     const auto& [colour, sign] = looks[static_cast<int>(m_mood)];
-    painter.setPen(QPen(Theme::Colour::Sunken, thick));
+    painter.setPen(QPen(Theme::Colour::Groove, thick));
     painter.drawEllipse(ring);
     painter.setPen(QPen(colour, thick, Qt::SolidLine, Qt::RoundCap));
     if (m_share > 0)
@@ -62,12 +62,11 @@ void Gauge::paintEvent(QPaintEvent*) {
         drawIcon(painter, ring.center(), m_theme.icon(sign, size, colour));
         return;
     }
-    QFont font = m_theme.font(Theme::Type::Display);
-    font.setPixelSize(m_theme.px(52));
+    QFont font = m_theme.font(Theme::Type::Number);
     // "12 / 250" has to stay within the ring.
     const double room = side - thick - m_theme.size(Space::Wide);
     if (const int wide = QFontMetrics(font).horizontalAdvance(m_large); wide > room)
-        font.setPixelSize(std::max(1, static_cast<int>(m_theme.px(52) * room / wide)));
+        font.setPixelSize(std::max(1, static_cast<int>(m_theme.text(Theme::Type::Number) * room / wide)));
     painter.setFont(font);
     painter.setPen(Theme::Colour::Ink);
     const double lift = m_small.isEmpty() ? 0 : m_theme.corner();

@@ -23,10 +23,11 @@ void drawIcon(QPainter& painter, QPointF centre, const QPixmap& icon) {
     painter.drawPixmap(centre - QPointF(size.width() / 2, size.height() / 2), icon);
 }
 
-QRectF drawCard(QPainter& painter, const QRect& place, QColor edge, QColor fill, double thick, double corner) {
+QRectF drawCard(QPainter& painter, const QRect& place, QColor edge, QColor fill, double thick, double corner,
+                Qt::PenStyle style) {
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
     const QRectF card = QRectF(place).adjusted(thick / 2, thick / 2, -thick / 2, -thick / 2);
-    painter.setPen(QPen(edge, thick));
+    painter.setPen(QPen(edge, thick, style));
     painter.setBrush(fill);
     painter.drawRoundedRect(card, corner, corner);
     return card;

@@ -12,7 +12,8 @@ void drawImage(QPainter& painter, const QRectF& place, const QImage& image);
 void drawIcon(QPainter& painter, QPointF centre, const QPixmap& icon);
 
 // Draws a box with rounded corners inside the rectangle; returns the rectangle along the middle of its outline.
-QRectF drawCard(QPainter& painter, const QRect& place, QColor edge, QColor fill, double thick, double corner);
+QRectF drawCard(QPainter& painter, const QRect& place, QColor edge, QColor fill, double thick, double corner,
+                Qt::PenStyle style = Qt::SolidLine);
 
 // The round sign in the upper corner of a card where the reading direction ends.
 struct Mark {

@@ -46,7 +46,7 @@ void PaletteBar::paintEvent(QPaintEvent*) {
         const QRectF box = QRectF(field * step, 0, step, height()).adjusted(inset, inset, -inset, -inset);
         const double corner = m_theme.size(Space::Small);
         const QColor colour(m_palette.pixel(field * m_palette.height(), 0));
-        painter.setPen(QPen(Theme::Colour::Edge, 1));
+        painter.setPen(QPen(Theme::Colour::Edge, m_theme.edge()));
         painter.setBrush(colour);
         painter.drawRoundedRect(box, corner, corner);
         if (field == chosenField()) {

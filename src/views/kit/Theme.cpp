@@ -19,6 +19,43 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+// What the pages are drawn with, by the names that the sheet has.
+const struct {
+    const char16_t* name;
+    QColor& colour;
+    QColor calm;
+    QColor contrast;
+} colours[] = {
+    {u"Paper", Theme::Colour::Paper, {0xF5, 0xF3, 0xEE}, {0xFF, 0xFF, 0xFF}},
+    {u"Surface", Theme::Colour::Surface, {0xFF, 0xFF, 0xFF}, {0xFF, 0xFF, 0xFF}},
+    {u"Sunken", Theme::Colour::Sunken, {0xEC, 0xE9, 0xE1}, {0xDC, 0xDC, 0xDC}},
+    {u"Line", Theme::Colour::Line, {0xD5, 0xD0, 0xC5}, {0x4A, 0x4A, 0x4A}},
+    {u"Groove", Theme::Colour::Groove, {0xEC, 0xE9, 0xE1}, {0x8C, 0x8C, 0x8C}},
+    {u"Track", Theme::Colour::Track, {0xD5, 0xD0, 0xC5}, {0x8C, 0x8C, 0x8C}},
+    {u"Here", Theme::Colour::Here, {0xFF, 0xFF, 0xFF}, {0xFF, 0xF6, 0xC2}},
+    {u"Edge", Theme::Colour::Edge, {0x8A, 0x86, 0x7C}, {0x00, 0x00, 0x00}},
+    {u"Ink", Theme::Colour::Ink, {0x1D, 0x25, 0x2C}, {0x00, 0x00, 0x00}},
+    {u"Muted", Theme::Colour::Muted, {0x57, 0x5F, 0x66}, {0x30, 0x30, 0x30}},
+    {u"Primary", Theme::Colour::Primary, {0x0E, 0x66, 0x6B}, {0x00, 0x3D, 0x42}},
+    {u"PrimaryDark", Theme::Colour::PrimaryDark, {0x0A, 0x4E, 0x52}, {0x00, 0x26, 0x29}},
+    {u"PrimarySoft", Theme::Colour::PrimarySoft, {0xDD, 0xEE, 0xED}, {0xC9, 0xF0, 0xEC}},
+    {u"Sun", Theme::Colour::Sun, {0xF2, 0xA9, 0x3B}, {0xDC, 0x84, 0x00}},
+    {u"SunEdge", Theme::Colour::SunEdge, {0xF2, 0xA9, 0x3B}, {0x7A, 0x4A, 0x00}},
+    {u"SunSoft", Theme::Colour::SunSoft, {0xFD, 0xF0, 0xD9}, {0xFF, 0xF1, 0xD6}},
+    {u"Danger", Theme::Colour::Danger, {0xB2, 0x32, 0x2A}, {0x8C, 0x00, 0x00}},
+    {u"DangerSoft", Theme::Colour::DangerSoft, {0xFB, 0xE6, 0xE3}, {0xFF, 0xE9, 0xE6}},
+    {u"Good", Theme::Colour::Good, {0x2B, 0x70, 0x3F}, {0x00, 0x45, 0x1B}},
+    {u"GoodSoft", Theme::Colour::GoodSoft, {0xE1, 0xF1, 0xE4}, {0xDF, 0xF6, 0xE4}},
+    {u"SkySoft", Theme::Colour::SkySoft, {0xD6, 0xEA, 0xF8}, {0xD6, 0xEA, 0xF8}},
+    {u"VioletSoft", Theme::Colour::VioletSoft, {0xE6, 0xDC, 0xF5}, {0xE6, 0xDC, 0xF5}},
+    {u"Marker", Theme::Colour::Marker, {0xFF, 0xD9, 0x1A}, {0xFF, 0xE6, 0x00}},
+    {u"Focus", Theme::Colour::Focus, {0x1F, 0x5F, 0xE0}, {0x00, 0x2F, 0xD6}},
+    {u"Veil", Theme::Colour::Veil, {0x1D, 0x25, 0x2C, 0x99}, {0x00, 0x00, 0x00, 0xCC}},
+};
+
+// Set by setLook(), as the colours are.
+Theme::Look shownLook = Theme::Look::Calm;
+
 // A piece of a line without the signs of the sentence around it; told apart where it has more than words.
 QString apart(QString piece, bool behindLetter) {
     static const QRegularExpression code(u"[0-9_@\\\\/^]|\\w\\.\\w"_s);
@@ -90,32 +127,24 @@ QMargins Theme::margins(Pad pad) const {
     return {px(room.width()), px(room.height()), px(room.width()), px(room.height())};
 }
 
+int Theme::text(Type type) const {
+    static constexpr int pixels[] = {13, 14, 15, 16, 17, 17, 19, 20, 22, 27, 40, 52, 84};
+    return px(pixels[static_cast<int>(type)]);
+}
+
+int Theme::edge() const {
+    return shownLook == Look::Contrast ? 2 : 1;
+}
+
+Qt::PenStyle Theme::edgeStyle(bool enabled) const {
+    // What is disabled is told by more than a shade.
+    return !enabled && shownLook == Look::Contrast ? Qt::DashLine : Qt::SolidLine;
+}
+
 QFont Theme::font(Type type) const {
     QFont font = QApplication::font();
-    switch (type) {
-    case Type::Small:
-        font.setPixelSize(px(14));
-        break;
-    case Type::Body:
-        font.setPixelSize(px(17));
-        break;
-    case Type::Strong:
-        font.setPixelSize(px(17));
-        font.setBold(true);
-        break;
-    case Type::Large:
-        font.setPixelSize(px(20));
-        font.setBold(true);
-        break;
-    case Type::Title:
-        font.setPixelSize(px(27));
-        font.setBold(true);
-        break;
-    case Type::Display:
-        font.setPixelSize(px(40));
-        font.setBold(true);
-        break;
-    }
+    font.setPixelSize(text(type));
+    font.setBold(type == Type::Strong || type >= Type::Large);
     return font;
 }
 
@@ -147,32 +176,43 @@ QIcon Theme::buttonIcon(const QString& name, int size, QColor colour, QColor whe
 }
 
 QString Theme::styleSheet() const {
-    static const std::map<QString, QColor> colours = {{u"Paper"_s, Colour::Paper},
-                                                      {u"Surface"_s, Colour::Surface},
-                                                      {u"Sunken"_s, Colour::Sunken},
-                                                      {u"Line"_s, Colour::Line},
-                                                      {u"Edge"_s, Colour::Edge},
-                                                      {u"Ink"_s, Colour::Ink},
-                                                      {u"Muted"_s, Colour::Muted},
-                                                      {u"Primary"_s, Colour::Primary},
-                                                      {u"PrimaryDark"_s, Colour::PrimaryDark},
-                                                      {u"PrimarySoft"_s, Colour::PrimarySoft},
-                                                      {u"Sun"_s, Colour::Sun},
-                                                      {u"SunSoft"_s, Colour::SunSoft},
-                                                      {u"Danger"_s, Colour::Danger},
-                                                      {u"DangerSoft"_s, Colour::DangerSoft},
-                                                      {u"Good"_s, Colour::Good},
-                                                      {u"GoodSoft"_s, Colour::GoodSoft},
-                                                      {u"SkySoft"_s, Colour::SkySoft},
-                                                      {u"VioletSoft"_s, Colour::VioletSoft}};
-    // Less the border of two pixels that the style adds.
-    const std::map<QString, int> sizes = {
-        {u"target"_s, target() - 2}, {u"row"_s, target()}, {u"key"_s, key() - 2}, {u"halfKey"_s, key() / 2}};
+    // Less the border that the style adds.
+    const int border = 2 * edge();
+    std::map<QString, QString> values;
+    for (const auto& [name, pixels] : {std::pair(u"target", target() - border),
+                                       {u"row", target()},
+                                       {u"key", key() - border},
+                                       {u"halfKey", key() / 2}})
+        values[QString::fromUtf16(name)] = QString::number(pixels);
+    for (const auto& [name, type] : {std::pair(u"Note", Type::Note),
+                                     {u"Small", Type::Small},
+                                     {u"Tall", Type::Tall},
+                                     {u"Word", Type::Word},
+                                     {u"Body", Type::Body},
+                                     {u"Field", Type::Field},
+                                     {u"Large", Type::Large},
+                                     {u"Key", Type::Key},
+                                     {u"Title", Type::Title},
+                                     {u"Display", Type::Display},
+                                     {u"Number", Type::Number},
+                                     {u"Giant", Type::Giant}})
+        values[u"text"_s + QString::fromUtf16(name)] = QString::number(text(type)) + u"px"_s;
+    for (const auto& row : colours)
+        values[QString::fromUtf16(row.name)] = row.colour.name();
+    const bool strong = shownLook == Look::Contrast;
+    values[u"edge"_s] = u"%1px"_s.arg(edge());
+    values[u"mark"_s] = u"%1px"_s.arg(edge() + 1);
+    values[u"off"_s] = strong ? u"dashed"_s : u"solid"_s;
+    // What has no outline in the calm look.
+    values[u"bare"_s] = strong ? u"%1px solid %2"_s.arg(edge()).arg(Colour::Edge.name()) : u"none"_s;
+    values[u"bareOff"_s] = strong ? u"%1px dashed %2"_s.arg(edge()).arg(Colour::Line.name()) : u"none"_s;
+    values[u"quiet"_s] = strong ? Colour::Line.name() : u"transparent"_s;
     QFile file(u":/theme.qss"_s);
     if (!file.open(QIODevice::ReadOnly))
         return {};
     const QString sheet = QString::fromUtf8(file.readAll());
-    static const QRegularExpression placeholder(u"@(\\d+)|\\$(target|row|halfKey|key|[A-Z]\\w+)"_s);
+    static const QRegularExpression placeholder(
+        u"@(\\d+)|\\$(target|row|halfKey|key|edge|mark|off|bareOff|bare|quiet|text[A-Z]\\w+|[A-Z]\\w+)"_s);
     QString result;
     qsizetype from = 0;
     for (auto it = placeholder.globalMatch(sheet); it.hasNext();) {
@@ -181,10 +221,8 @@ QString Theme::styleSheet() const {
         result += QStringView(sheet).mid(from, match.capturedStart() - from);
         if (name.isEmpty())
             result += QString::number(px(match.capturedView(1).toInt()));
-        else if (const auto size = sizes.find(name); size != sizes.end())
-            result += QString::number(size->second);
         else
-            result += colours.at(name).name();
+            result += values.at(name);
         from = match.capturedEnd();
     }
     return result += QStringView(sheet).mid(from);
@@ -198,6 +236,13 @@ void Theme::apply(QApplication& application) {
     font.setFamilies({u"Noto Sans"_s, u"Noto Sans Hebrew"_s, u"DejaVu Sans"_s});
     font.setPixelSize(17);
     application.setFont(font);
+    setLook(Look::Calm);
+}
+
+void Theme::setLook(Look look) {
+    shownLook = look;
+    for (const auto& row : colours)
+        row.colour = look == Look::Contrast ? row.contrast : row.calm;
     QPalette palette;
     palette.setColor(QPalette::Window, Colour::Paper);
     palette.setColor(QPalette::Base, Colour::Surface);

@@ -27,31 +27,41 @@ enum class Extent { Drawing, Field, WideField, Bar, Form };
 // The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
 class Theme {
 public:
-    // Ink on Paper, Ink and Muted on Surface, and white on Primary and Danger keep a contrast of 4.5 or more.
-    struct Colour {
-        static constexpr QColor Paper{0xF5, 0xF3, 0xEE};   // behind everything
-        static constexpr QColor Surface{0xFF, 0xFF, 0xFF}; // cards, fields
-        static constexpr QColor Sunken{0xEC, 0xE9, 0xE1};  // wells, tracks
-        static constexpr QColor Line{0xD5, 0xD0, 0xC5};    // hairlines
-        static constexpr QColor Edge{0x8A, 0x86, 0x7C};    // outlines of what can be pressed (3:1)
-        static constexpr QColor Ink{0x1D, 0x25, 0x2C};     // text
-        static constexpr QColor Muted{0x57, 0x5F, 0x66};   // second text
-        static constexpr QColor Primary{0x0E, 0x66, 0x6B}; // the main action, what is chosen
-        static constexpr QColor PrimaryDark{0x0A, 0x4E, 0x52};
-        static constexpr QColor PrimarySoft{0xDD, 0xEE, 0xED};
-        static constexpr QColor Sun{0xF2, 0xA9, 0x3B}; // the one warm accent; never a text colour
-        static constexpr QColor SunSoft{0xFD, 0xF0, 0xD9};
-        static constexpr QColor Danger{0xB2, 0x32, 0x2A};
-        static constexpr QColor DangerSoft{0xFB, 0xE6, 0xE3};
-        static constexpr QColor Good{0x2B, 0x70, 0x3F};
-        static constexpr QColor GoodSoft{0xE1, 0xF1, 0xE4};
-        // The red-eye page's texts name these two: the buttons that move the circle, and those that size it.
-        static constexpr QColor SkySoft{0xD6, 0xEA, 0xF8};
-        static constexpr QColor VioletSoft{0xE6, 0xDC, 0xF5};
-        static constexpr QColor Marker{0xFF, 0xD9, 0x1A};     // the yellow circle itself
-        static constexpr QColor Focus{0x1F, 0x5F, 0xE0};      // the ring around the control that has the keyboard
-        static constexpr QColor Veil{0x1D, 0x25, 0x2C, 0x99}; // over a page that has a panel in front
+    enum class Look {
+        Calm, // Ink on Paper, Ink and Muted on Surface, and white on Primary and Danger keep a contrast of 4.5 or more
+        Contrast // black on white with strong edges: each text keeps a contrast of 7 or more
     };
+    // As the look of the application has them: setLook() gives their values.
+    struct Colour {
+        static inline QColor Paper;   // behind everything
+        static inline QColor Surface; // cards, fields
+        static inline QColor Sunken;  // wells, tracks
+        static inline QColor Line;    // hairlines
+        static inline QColor Groove;  // of a gauge
+        static inline QColor Track;   // the way that is still to come
+        static inline QColor Here;    // the field that is typed into
+        static inline QColor Edge;    // outlines of what can be pressed (3:1)
+        static inline QColor Ink;     // text
+        static inline QColor Muted;   // second text
+        static inline QColor Primary; // the main action, what is chosen
+        static inline QColor PrimaryDark;
+        static inline QColor PrimarySoft;
+        static inline QColor Sun; // the one warm accent; never a text colour
+        static inline QColor SunEdge;
+        static inline QColor SunSoft;
+        static inline QColor Danger;
+        static inline QColor DangerSoft;
+        static inline QColor Good;
+        static inline QColor GoodSoft;
+        // The red-eye page's texts name these two: the buttons that move the circle, and those that size it.
+        static inline QColor SkySoft;
+        static inline QColor VioletSoft;
+        static inline QColor Marker; // the yellow circle itself
+        static inline QColor Focus;  // the ring around the control that has the keyboard
+        static inline QColor Veil;   // over a page that has a panel in front
+    };
+    // To be called before a page is made: what is on the screen keeps the look that it has.
+    static void setLook(Look look);
 
     // The factor of the largest logical page that fits the window.
     static double factorFor(QSize window);
@@ -69,6 +79,8 @@ public:
     int gap() const { return size(Space::Normal); }
     int margin() const { return size(Space::Far); } // of a page
     int corner() const { return px(14); }
+    int edge() const; // in pixels of the screen: the outline of a card and of what can be pressed
+    Qt::PenStyle edgeStyle(bool enabled) const;
     int hair() const { return px(2); }  // a line that is to be noticed
     int thick() const { return px(3); } // a line around what is chosen
     // No control that can be pressed is smaller than this, on any window.
@@ -76,7 +88,9 @@ public:
     // Plus and minus of a small picture: as small as a target may be.
     int key() const { return px(44) < 44 ? 44 : px(44); }
 
-    enum class Type { Small, Body, Strong, Large, Title, Display };
+    // The sizes of text.
+    enum class Type { Note, Small, Tall, Word, Body, Strong, Field, Large, Key, Title, Display, Number, Giant };
+    int text(Type type) const;
     QFont font(Type type) const;
 
     // One of our own drawings (views/icons), in one colour.
@@ -85,7 +99,7 @@ public:
 
     QString styleSheet() const;
 
-    // Fonts, palette and style of the application.
+    // Fonts, style and the calm look of the application.
     static void apply(QApplication& application);
 
 private:

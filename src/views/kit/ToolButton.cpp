@@ -84,7 +84,7 @@ void ToolButton::paintEvent(QPaintEvent*) {
              !isEnabled()           ? Theme::Colour::Sunken
              : isDown() || m_marked ? Theme::Colour::PrimarySoft
                                     : Theme::Colour::Surface,
-             m_marked || isDown() ? m_theme.hair() : 1, m_theme.px(11));
+             m_marked || isDown() ? m_theme.hair() : m_theme.edge(), m_theme.px(11), m_theme.edgeStyle(isEnabled()));
     if (isDown()) // sunk
         painter.translate(0, m_theme.px(1));
 

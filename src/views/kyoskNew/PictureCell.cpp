@@ -121,7 +121,7 @@ void PictureCell::paintEvent(QPaintEvent*) {
     painter.setLayoutDirection(layoutDirection());
     const bool lively = underMouse() && isEnabled();
     const QRectF card = drawCard(painter, rect(),
-                                 m_look.inEditor           ? Theme::Colour::Sun
+                                 m_look.inEditor           ? Theme::Colour::SunEdge
                                  : m_look.chosen || lively ? Theme::Colour::Primary
                                                            : Theme::Colour::Line,
                                  m_look.chosen                                  ? Theme::Colour::PrimarySoft
@@ -129,7 +129,7 @@ void PictureCell::paintEvent(QPaintEvent*) {
                                                                                 : Theme::Colour::Paper,
                                  m_look.chosen || m_look.inEditor ? theme().thick()
                                  : lively                         ? theme().hair()
-                                                                  : 1,
+                                                                  : theme().edge(),
                                  theme().corner());
     if (!m_look.filled)
         return;

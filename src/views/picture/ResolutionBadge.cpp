@@ -22,7 +22,7 @@ GradeLook lookOf(PrintResolution::Grade grade) {
     case PrintResolution::Grade::Sharp:
         return {u"tick"_s, Theme::Colour::Good, Theme::Colour::GoodSoft, Theme::Colour::Good};
     case PrintResolution::Grade::Fair:
-        return {u"info"_s, Theme::Colour::Ink, Theme::Colour::SunSoft, Theme::Colour::Sun};
+        return {u"info"_s, Theme::Colour::Ink, Theme::Colour::SunSoft, Theme::Colour::SunEdge};
     case PrintResolution::Grade::Coarse:
         break;
     }

@@ -20,7 +20,7 @@ void StripCell::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     const bool lively = underMouse() && m_look.filled;
     const QRectF card = drawCard(painter, rect(),
-                                 m_look.open ? Theme::Colour::Sun
+                                 m_look.open ? Theme::Colour::SunEdge
                                  : lively    ? Theme::Colour::Primary
                                              : Theme::Colour::Line,
                                  m_look.open     ? Theme::Colour::SunSoft
@@ -28,7 +28,7 @@ void StripCell::paintEvent(QPaintEvent*) {
                                                  : Theme::Colour::Paper,
                                  m_look.open ? theme().thick()
                                  : lively    ? theme().hair()
-                                             : 1,
+                                             : theme().edge(),
                                  theme().px(9));
     if (!m_look.filled)
         return;

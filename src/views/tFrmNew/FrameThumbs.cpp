@@ -54,7 +54,7 @@ public:
                                      : lively                                ? Theme::Colour::Edge
                                                                              : Theme::Colour::Line,
                                      worn ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
-                                     worn ? m_theme.thick() : m_theme.px(1), m_theme.px(8));
+                                     worn ? m_theme.thick() : std::max(m_theme.px(1), m_theme.edge()), m_theme.px(8));
         const int inset = m_theme.size(Space::Tight);
         const QImage& frame = clear(index.row());
         const QRectF paper =

@@ -19,6 +19,10 @@ Application::Application(int& argc, char** argv)
     tellScreenReaders();
 }
 
+void Application::setContrast(bool on) {
+    Theme::setLook(on ? Theme::Look::Contrast : Theme::Look::Calm);
+}
+
 bool Application::notify(QObject* receiver, QEvent* event) {
     // No exception may pass through Qt's event loop: nothing behind it is certain to be whole.
     try {

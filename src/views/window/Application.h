@@ -12,6 +12,9 @@ public:
     // argc and argv must live as long as the application.
     Application(int& argc, char** argv);
 
+    // The look of all pages: our own one of strong contrast, or the calm one.
+    static void setContrast(bool on);
+
     bool notify(QObject* receiver, QEvent* event) override;
 };
 

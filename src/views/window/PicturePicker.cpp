@@ -67,7 +67,7 @@ public:
                                      : focused ? Theme::Colour::Focus
                                                : Theme::Colour::Line,
                                      chosen ? Theme::Colour::PrimarySoft : Theme::Colour::Surface,
-                                     chosen || focused ? m_theme.thick() : 1, m_theme.corner());
+                                     chosen || focused ? m_theme.thick() : m_theme.edge(), m_theme.corner());
         const QRectF box = cell.adjusted(m_theme.size(Space::Small), m_theme.size(Space::Small),
                                          -m_theme.size(Space::Small), -m_theme.px(36));
         const QImage picture = index.data(PictureRole).value<QImage>();

@@ -56,7 +56,7 @@ void StepBar::paintEvent(QPaintEvent*) {
         return QPointF(layoutDirection() == Qt::RightToLeft ? width() - along : along, y);
     };
     for (int i = 0; i + 1 < count; ++i) {
-        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Line, m_theme.thick(), Qt::SolidLine,
+        painter.setPen(QPen(i < current ? Theme::Colour::Primary : Theme::Colour::Track, m_theme.thick(), Qt::SolidLine,
                             Qt::RoundCap));
         const QPointF a = centre(i);
         const QPointF b = centre(i + 1);
