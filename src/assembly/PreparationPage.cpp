@@ -96,11 +96,8 @@ void PreparationPage::handOver(Outcome toSender) {
              u"The order is ready, but this version has no page to go on with it."_s,
              m_state.transfer.OrderFolder.text());
     if (!goesOn || prepared == Outcome::KeptAtStation)
-        m_state.handOver.notice =
-            m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
-                .arg(m_state.MisparHazmana);
-    if (prepared == Outcome::KeptAtStation && !m_state.transfer.leftOut.isEmpty())
-        m_state.handOver.notice += u' ' + LeftOutText(m_state);
+        m_state.handOver.kept = {m_state.MisparHazmana,
+                                 prepared == Outcome::KeptAtStation ? m_state.transfer.leftOut.size() : 0};
     if (!m_chain.follow(id(), prepared))
         m_chain.unload(id());
 }

@@ -50,13 +50,13 @@ Result<void> CustomerTraces::clear() const {
     return m_platform.instances.another() ? Result<void>() : clearFiles();
 }
 
-// The notice is for whoever comes to the start page.
+// The line of a kept order is for whoever comes to the start page.
 void CustomerTraces::clearSession() const {
     SessionState fresh;
     fresh.DiskRoot = m_state.DiskRoot;
     fresh.waitingOrders = m_state.waitingOrders;
     fresh.slipTrouble = m_state.slipTrouble;
-    fresh.handOver.notice = m_state.handOver.notice;
+    fresh.handOver.kept = m_state.handOver.kept;
     m_state = std::move(fresh);
 }
 

@@ -62,7 +62,7 @@ private:
     bool m_wayBack = true;
 };
 
-// How many pictures are not in the order, as a sentence; empty for none.
-QString LeftOutText(const SessionState& state);
+// That so many pictures are not in the order, as a sentence; empty for none.
+QString LeftOutText(const SessionState& state, qsizetype count);
 
 } // namespace lumora

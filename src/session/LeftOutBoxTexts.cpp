@@ -28,8 +28,7 @@ QString reasonText(const SessionState& state, LeftOut::Why why) {
 
 } // namespace
 
-QString LeftOutText(const SessionState& state) {
-    const qsizetype count = state.transfer.leftOut.size();
+QString LeftOutText(const SessionState& state, qsizetype count) {
     if (count == 0)
         return {};
     if (count == 1)
@@ -41,7 +40,7 @@ QString LeftOutText(const SessionState& state) {
 void LeftOutBox::show() {
     const bool one = m_state.transfer.leftOut.size() == 1;
     const bool withoutPrints = m_order == Order::WithoutPrints;
-    m_shown.Label4Kartis.text = LeftOutText(m_state);
+    m_shown.Label4Kartis.text = LeftOutText(m_state, m_state.transfer.leftOut.size());
     m_shown.Label4Kartis.visible = !m_shown.Label4Kartis.text.isEmpty();
     m_shown.Label4Hasserot.text = withoutPrints
                                       ? m_state.wording(u"אין בהזמנה אף תמונה שניתן להדפיס, ולכן היא לא תישלח.",

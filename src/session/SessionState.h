@@ -220,20 +220,27 @@ struct ClosingEntries {
     QString Text2;            // note
 };
 
+// An order that stays at the station, for the line that the start page has for the customer. Its facts and not the
+// line: the start page opens in its own language and may turn.
+struct KeptOrder {
+    QString number; // empty: there is none
+    qsizetype leftOut = 0;
+};
+
 // The lines that one page copies into a list of the next, and what it asks the next page to do with them.
 struct HandOver {
     QStringList lines;
     bool pressStart = false; // the next page starts its work by itself once it is shown
-    QString notice;          // a line for the customer that the start page shows
-    DrivePath takenUp;       // folder of the order that goes on from another run; empty for a new order
-    DrivePath replaced;      // folder of the order that the next one is prepared again from
-    int renumbered = 0;      // times in a row that this was done
-    QStringList basket;      // the lines that the page of pictures handed over, for the way back to it
-    QStringList pictures;    // all pictures that it offered
-    ClosingEntries closing;  // what was typed there
-    OrderDetails details;    // of the order, without mail address and note
-    DrivePath doorFolder;    // where its pictures were made that are no ordinary JPEG files
-    bool back = false;       // it takes all of them back
+    KeptOrder kept;
+    DrivePath takenUp;      // folder of the order that goes on from another run; empty for a new order
+    DrivePath replaced;     // folder of the order that the next one is prepared again from
+    int renumbered = 0;     // times in a row that this was done
+    QStringList basket;     // the lines that the page of pictures handed over, for the way back to it
+    QStringList pictures;   // all pictures that it offered
+    ClosingEntries closing; // what was typed there
+    OrderDetails details;   // of the order, without mail address and note
+    DrivePath doorFolder;   // where its pictures were made that are no ordinary JPEG files
+    bool back = false;      // it takes all of them back
 };
 
 struct SessionState {

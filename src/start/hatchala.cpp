@@ -5,6 +5,8 @@
 #include "session/WebPages.h"
 #include "session/lab/ClientProfile.h"
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -29,11 +31,9 @@ void hatchala::load() {
     m_state.SugTzad = m_deployment.SugTzad;
     loadProfile();
     offerUnfinished();
+    m_kept = std::exchange(m_state.handOver.kept, {});
     setTexts();
     Label6.text = QString::number(m_secondsLeft);
-    Notice.text = m_state.handOver.notice;
-    Notice.visible = !Notice.text.isEmpty();
-    m_state.handOver.notice.clear();
     m_timers.Timer2.start();
     m_timers.Timer5.start();
 }

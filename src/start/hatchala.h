@@ -176,6 +176,7 @@ private:
     void showOffer();
     void showDigits();
     void showWaiting();
+    void showKept();
     void goOnWithOrder();
     void putOffOrder();
     void throwOrderAway();
@@ -210,12 +211,13 @@ private:
     StartMotion m_motion;
     Hover m_over = Hover::Nothing;
     QList<UnfinishedOrder> m_unfinished; // the first one is offered
-    bool m_recognised = false;           // on a kiosk: the customer of the first one has given the digits
-    bool m_ofStaff = false;              // the offer was read for the staff
-    QString m_digits;                    // typed so far
-    int m_wrongDigits = 0;               // times in a row
-    bool m_asksForGone = false;          // the panel asks whether to go on without the pictures that are gone
-    int m_secondsLeft = 5;               // of the countdown
+    KeptOrder m_kept;
+    bool m_recognised = false;  // on a kiosk: the customer of the first one has given the digits
+    bool m_ofStaff = false;     // the offer was read for the staff
+    QString m_digits;           // typed so far
+    int m_wrongDigits = 0;      // times in a row
+    bool m_asksForGone = false; // the panel asks whether to go on without the pictures that are gone
+    int m_secondsLeft = 5;      // of the countdown
     bool m_leaving = false;
 };
 

@@ -2,6 +2,7 @@
 #include "order/KioskOffer.h"
 #include "platform/Dialogs.h"
 #include "session/CaptionTexts.h"
+#include "session/LeftOutBox.h"
 #include "session/SessionState.h"
 #include "start/ShopRows.h"
 #include "start/hatchala.h"
@@ -56,6 +57,7 @@ void hatchala::setTexts() {
     setHelp();
     showOffer();
     showWaiting();
+    showKept();
 
     const int chosen = List1.currentIndex();
     List1.clear();
@@ -63,6 +65,15 @@ void hatchala::setTexts() {
     List1.setCurrentIndex(chosen);
     showProfile();
     Q_EMIT changed();
+}
+
+void hatchala::showKept() {
+    Notice.visible = !m_kept.number.isEmpty();
+    Notice.text =
+        m_state.wording(u"הזמנה מספר %1 מוכנה ונשמרה בתחנה.", u"Order number %1 is ready and kept at this station.")
+            .arg(m_kept.number);
+    if (m_kept.leftOut > 0)
+        Notice.text += u' ' + LeftOutText(m_state, m_kept.leftOut);
 }
 
 void hatchala::showOffer() {

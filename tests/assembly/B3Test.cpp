@@ -206,7 +206,7 @@ TEST_F(PreparingAnEditedOrder, savesSheetTailAndWayAsTheirReceiverWantsThem) {
         state.MisparHazmana = u"105"_s;
         state.transfer.SugSheliach = sender;
         state.TachanaMekomit = local;
-        state.handOver.notice.clear();
+        state.handOver.kept = {};
         machine.dialogs.messages.clear();
         if (next == PageId::UploadForm)
             registerBare({PageId::UploadForm});
@@ -217,7 +217,7 @@ TEST_F(PreparingAnEditedOrder, savesSheetTailAndWayAsTheirReceiverWantsThem) {
         EXPECT_EQ(made.tail, edits ? tail : tail + "^one_1              ") << "an edited order's is always short";
         EXPECT_EQ(take(ReadOrderState(machine.files, OrderFolder(folder()))).way, way);
         EXPECT_EQ(front(), next);
-        EXPECT_EQ(state.handOver.notice.contains(u"105"_s), next == PageId::hatchala);
+        EXPECT_EQ(state.handOver.kept.number == u"105", next == PageId::hatchala);
         EXPECT_EQ(machine.dialogs.messages.size(), messages);
         chain.unload(front());
         std::filesystem::remove_all(host(folder()));

@@ -216,7 +216,7 @@ TEST_F(PreparingAPlainOrder, namesWhatItLeavesOutAndGoesOnWithoutItOrBackToThePi
         EXPECT_EQ(machine.files.folderExists(folder()), c.answer != Answer::Back);
         EXPECT_EQ(state.transfer.leftOut.size(), c.leftOut);
         EXPECT_EQ(state.handOver.back, c.answer == Answer::Back);
-        EXPECT_EQ(state.handOver.notice.contains(u"4 תמונות"_s), c.answer == Answer::GoOn && c.station);
+        EXPECT_EQ(state.handOver.kept.leftOut == 4, c.answer == Answer::GoOn && c.station);
         EXPECT_EQ(state.handOver.basket, c.items);
         EXPECT_EQ(state.MisparHazmana, u"105"_s);
         for (const PageId id : {PageId::FtpFrm, PageId::kyoskNew, PageId::hatchala, PageId::Form2})

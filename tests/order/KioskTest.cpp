@@ -49,7 +49,7 @@ TEST_F(AKioskBetweenCustomers, HasNothingOfTheOneBeforeButTheOrder) {
           "2000lumora\\!!000\\^^^.jpg", "2000lumora\\!!000\\111.jpg"});
     state.staff = true;
     state.EnglishTips = 1;
-    state.handOver.notice = u"order 104 stays here"_s;
+    state.handOver.kept.number = u"104"_s;
     machine.shell.clipboard = u"105"_s;
 
     ASSERT_TRUE(CustomerTraces(state, machine.platform).clear());
@@ -57,7 +57,7 @@ TEST_F(AKioskBetweenCustomers, HasNothingOfTheOneBeforeButTheOrder) {
     EXPECT_TRUE(machine.shell.clipboard.isEmpty());
     EXPECT_TRUE(state.shemot.n1.isEmpty() && state.shemot.n2.isEmpty());
     EXPECT_FALSE(state.staff || state.english());
-    EXPECT_EQ(state.handOver.notice, u"order 104 stays here") << "said to the one who comes";
+    EXPECT_EQ(state.handOver.kept.number, u"104") << "said to the one who comes";
 }
 
 TEST(AnOrderOnAKiosk, OpensByTheLastThreeDigitsOfItsTelephonesAlone) {

@@ -49,15 +49,18 @@ TEST_F(hatchalaTest, OpensInHebrewWithTheProfileOfTheLab) {
     deployment.SugTzad = 60;
     deployment.profile.LabPhone = u"09-9"_s;
     deployment.profile.LabMail = u"lab@example.com"_s;
-    state.handOver.notice = u"order 104 stays here"_s;
+    state.handOver.kept = {u"104"_s, 2};
     hatchala& page = start();
     EXPECT_EQ(state.EnglishTips, 0);
     EXPECT_EQ(state.SugTzad, 60);
     EXPECT_EQ(page.controls().List1.items(), QStringList({"* Haifa", "* Yaffo"}));
     EXPECT_EQ(page.controls().Label4Tel.text + page.controls().Label1.text, u"09-9lab@example.com");
-    EXPECT_EQ(page.controls().Notice.text, u"order 104 stays here");
-    EXPECT_TRUE(page.controls().Notice.visible);
-    EXPECT_TRUE(state.handOver.notice.isEmpty()) << "the line is for one customer";
+    EXPECT_TRUE(page.controls().Notice.visible && page.controls().Notice.text.contains(u"104 מוכנה"));
+    EXPECT_TRUE(state.handOver.kept.number.isEmpty()) << "the line is for one customer";
+    page.Check1_Click(true);
+    EXPECT_EQ(page.controls().Notice.text, u"Order number 104 is ready and kept at this station. 2 pictures that you "
+                                           "chose are not in the order.");
+    page.Command4Ivrit_Click();
     EXPECT_TRUE(page.timers().Timer2.running() && page.timers().Timer5.running());
     EXPECT_FALSE(page.timers().Timer1.running() || page.timers().Timer3.running() || page.timers().Timer4.running());
 }

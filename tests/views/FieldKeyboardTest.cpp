@@ -189,6 +189,19 @@ TEST(FieldKeyboard, TakesADoubledTouchOfAFieldForOneAndFastTypingForTyping) {
     }
 }
 
+TEST(FieldKeyboard, TurnsItsLanguageWithThePageBelowIt) {
+    Finger finger({{1024, 768}, false});
+    finger.go(toDetails);
+    finger.touch(finger.middleOf(finger.field(u"Text2"_s)));
+    ASSERT_TRUE(finger.keysRise());
+    finger.window().presses().rest();
+    finger.touch(finger.middleOf(finger.walk.control(u"Command4Anglit"_s)));
+    finger.walk.settle();
+    ASSERT_TRUE(finger.keysRise());
+    EXPECT_EQ(finger.keys()->layoutDirection(), Qt::LeftToRight);
+    EXPECT_EQ(finger.keys()->findChild<QPushButton*>(u"keyDone"_s)->text(), u"Done");
+}
+
 class KeyboardLook : public PageLook {};
 
 TEST_P(KeyboardLook, HasNoFaultInItsKeysAndTypesCopies) {

@@ -97,6 +97,11 @@ bool FieldKeyboard::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::KeyPress:
         sink();
         break;
+    case QEvent::LayoutDirectionChange:
+        // The page has turned its language below the keys.
+        if (m_field && widget->isAncestorOf(m_field))
+            setUp();
+        break;
     default:
         break;
     }
@@ -160,6 +165,7 @@ void FieldKeyboard::setUp() {
     const auto say = [this](const char16_t* hebrew, const char16_t* english) {
         return m_state.wording(hebrew, english);
     };
+    m_keys->setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
     m_keys->setWords({say(u"מחק את האות האחרונה", u"Take back the last letter"), say(u"הבא", u"Next"),
                       say(u"סיום", u"Done"), say(u"רווח", u"Space"), say(u"אותיות גדולות", u"Capitals"), u"עברית"_s,
                       u"English"_s});
