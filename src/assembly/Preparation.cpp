@@ -75,10 +75,9 @@ Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
     m_others.clear();
     if (m_folder && m_folder->path() == OrderFolder::inPreparation(m_state, ending).path()) {
         m_journal.emplace(files, *m_folder);
-        if (m_goesOn && m_journal->state().items == m_lines)
-            findPrints();
-        else
-            removePrints();
+        const bool sameLines = m_goesOn && m_journal->state().items == m_lines;
+        if (const Result<void> kept = sameLines ? findPrints() : removePrints(); !kept)
+            return kept;
         if (const QString replaces = m_journal->state().replaces; !replaces.isEmpty())
             m_replaced = m_folder->path().folder() / replaces;
         return makeOrderFolder(files, *m_folder); // it may have been removed meanwhile
@@ -93,7 +92,7 @@ Result<void> Preparation::readyFolder(OrderFolder::Ending ending) {
 }
 
 // All prints of an order have one shape, and the lab's settings may have changed meanwhile.
-void Preparation::findPrints() {
+Result<void> Preparation::findPrints() {
     const LineForm form = lineFormOf(m_state.Optint);
     for (int i = 0; i < m_lines.size(); ++i) {
         const BasketLine line = BasketLine::split(m_lines[i], form);
@@ -101,16 +100,20 @@ void Preparation::findPrints() {
         if (!line.hasUsableName() || !m_platform.files.fileExists(print))
             continue;
         if (m_there.isEmpty() && !PrintFits(m_state, m_platform.files, print)) {
-            removePrints();
-            return;
+            return removePrints();
         }
         m_there += i;
     }
+    return {};
 }
 
-void Preparation::removePrints() const {
-    for (const QString& name : m_platform.files.names(m_folder->path(), u"*.jpp"_s))
-        static_cast<void>(m_platform.files.removeFile(m_folder->filePath(name)));
+// A print that stayed would be sent with the order and printed.
+Result<void> Preparation::removePrints() const {
+    for (const QString& name : m_platform.files.names(m_folder->path(), u"*.jpp"_s)) {
+        if (const Result<void> removed = m_platform.files.removeFile(m_folder->filePath(name)); !removed)
+            return removed;
+    }
+    return {};
 }
 
 // An order without its state can be sent all the same, it only can't be taken up again; without a thumbnail a cell of

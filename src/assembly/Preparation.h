@@ -104,8 +104,8 @@ protected:
 
 private:
     Result<void> readyFolder(OrderFolder::Ending ending);
-    void findPrints();
-    void removePrints() const;
+    Result<void> findPrints();
+    Result<void> removePrints() const;
     void removeWhatIsNotNeeded();
 
     std::optional<OrderJournal> m_journal; // of m_folder

@@ -252,6 +252,8 @@ TEST(FtpFrm, PrintsASlipAndTellsTheCustomerOnceTheQueueHasIt) {
         EXPECT_EQ(page.controls().slip.visible, takes);
         EXPECT_EQ(state.slipTrouble, takes ? u""_s : u"no such queue"_s);
         EXPECT_EQ(OrderSlip::codeOf(state), FtpFrmRig::name() + u"\n13\n03-1234567"_s) << "no name";
+        state.shemot.n2 = u"***"_s;
+        EXPECT_EQ(OrderSlip::codeOf(state), FtpFrmRig::name() + u"\n13\n"_s) << "the session's mark for none";
         line.rig.chain.unload(PageId::FtpFrm);
         printer.whenDone({});
     }

@@ -455,6 +455,10 @@ QStringList RandomWalk::missingWays(const PageView& view) {
     }
     if (m_acting || m_program->chain().isAnyWorking() || m_program->platform().pump.pumping())
         return {};
+    // The keys on the screen cover the page's buttons until they are done.
+    const auto done = m_program->window().findChildren<QAbstractButton*>(u"keyDone"_s);
+    if (std::any_of(done.begin(), done.end(), canBePressed))
+        return {};
     QStringList missing;
     const std::vector<QWidget*> widgets = usable(view);
     const auto leads = [&](const WayRow& row) {

@@ -22,6 +22,9 @@ inline constexpr int mostFacts = 8;
 // may be a studio's.
 QString CalledName(const SessionState& state);
 
+// Where the customer is reached; empty where no telephone is known.
+QString GivenTelephone(const SessionState& state);
+
 // The number that a customer can remember, of an order's name.
 QString ShortNumber(const QString& orderName);
 

@@ -121,7 +121,7 @@ QList<OrderFact> OrderFacts(const SessionState& state) {
     const int prints = state.shemot.TotalPics;
     QList<OrderFact> facts{
         {state.wording(u"שם", u"Name"), toldOf(state, &AlbumDetails::ShemZalam, &OrderDetails::n1)},
-        {state.wording(u"טלפון", u"Telephone"), toldOf(state, &AlbumDetails::TelZalam, &OrderDetails::n2)},
+        {state.wording(u"טלפון", u"Telephone"), GivenTelephone(state)},
         {state.wording(u"תמונות", u"Prints"), prints > 0 ? QString::number(prints) : QString()},
         {state.wording(u"נייר", u"Paper"), state.Optint == OrderKind::Album ? QString() : paperText(state)},
         {state.wording(u"אלבום", u"Album"), state.Optint == OrderKind::Album ? albumText(state) : QString()},
@@ -136,6 +136,10 @@ QList<OrderFact> OrderFacts(const SessionState& state) {
 QString CalledName(const SessionState& state) {
     const QString name = toldOf(state, &AlbumDetails::ShemZalam, &OrderDetails::n1);
     return state.Optint == OrderKind::Album ? name : name.section(u' ', 0, 0, QString::SectionSkipEmpty);
+}
+
+QString GivenTelephone(const SessionState& state) {
+    return toldOf(state, &AlbumDetails::TelZalam, &OrderDetails::n2);
 }
 
 QString ShortNumber(const QString& orderName) {

@@ -44,15 +44,11 @@ QString inLeftToRight(const QString& text) {
     return u"\u2066%1\u2069"_s.arg(text);
 }
 
-QString slipTelephone(const SessionState& state) {
-    return (state.Optint == OrderKind::Album ? state.album.TelZalam : state.shemot.n2).trimmed();
-}
-
 } // namespace
 
 QString OrderSlip::codeOf(const SessionState& state) {
     return QStringList(
-               {OrderFolder::chosen(state).name(), QString::number(state.shemot.TotalPics), slipTelephone(state)})
+               {OrderFolder::chosen(state).name(), QString::number(state.shemot.TotalPics), GivenTelephone(state)})
         .join(u'\n');
 }
 
@@ -69,7 +65,7 @@ OrderSlip::OrderSlip(const SessionState& state)
     m_rows += {{}, inLeftToRight(ShortNumber(order)), 160, 150, true};
     m_rows += {{}, inLeftToRight(order), 60, 26};
     m_rows += {words(slipPrintsWords), inLeftToRight(QString::number(state.shemot.TotalPics)), 60, 40, true};
-    if (const QString telephone = slipTelephone(state); !telephone.isEmpty())
+    if (const QString telephone = GivenTelephone(state); !telephone.isEmpty())
         m_rows += {words(slipTelephoneWords), inLeftToRight(telephone), 60, 40, true};
     if (const QString lab = state.profile.LabPhone.trimmed(); !lab.isEmpty())
         m_end = words(forQuestionsWords).trimmed().arg(inLeftToRight(lab));
