@@ -450,8 +450,12 @@ QStringList RandomWalk::missingWays(const PageView& view) {
     };
     if (const Overlay* panel = frontOverlay(m_program->window())) {
         const auto buttons = panel->findChildren<QAbstractButton*>();
-        return std::any_of(buttons.begin(), buttons.end(), canBePressed) ? QStringList()
-                                                                         : QStringList(u"no way out of a panel"_s);
+        if (std::any_of(buttons.begin(), buttons.end(), canBePressed))
+            return {};
+        QStringList why{u"no way out of panel %1:"_s.arg(panel->objectName())};
+        for (const QAbstractButton* button : buttons)
+            why += button->objectName() + u' ' + ControlFinder::whyNotPressable(*button);
+        return {why.join(u' ')};
     }
     if (m_acting || m_program->chain().isAnyWorking() || m_program->platform().pump.pumping())
         return {};
