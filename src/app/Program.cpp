@@ -59,7 +59,7 @@ struct Program::Parts {
                  })
         , cards(deployment.watchedCards ? std::move(media) : Cards::Source(), deployment.door.everyFormat)
         , clock(time ? *time : systemClock)
-        , internet({}, deployment.ftpType)
+        , internet({}, deployment.ftpType, deployment.encryption)
         , shell(drives, std::move(opener))
         , chain(pump)
         , window(chain, state)

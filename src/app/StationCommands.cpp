@@ -40,7 +40,7 @@ void printLine(const CheckLine& line) {
 int checkStation(const ProgramOptions& options, bool writes) {
     const std::optional<HostPath> labFile = usedLabFile(options);
     const LabFileReading lab = labFile ? ReadLabFile(*labFile) : LabFileReading();
-    PocoInternet line({}, lab.deployment.ftpType);
+    PocoInternet line({}, lab.deployment.ftpType, lab.deployment.encryption);
     StationCheck check(lab, usedDataFolder(options, lab.deployment), doorProgram(), line, printLine);
     const bool good = check.run(labFile.value_or(HostPath()),
                                 writes ? StationCheck::Server::IsWritten : StationCheck::Server::IsRead);

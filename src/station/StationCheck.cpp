@@ -37,10 +37,39 @@ QString gigabytes(qint64 bytes) {
 // The line ends of the probe grow or shrink on a server that changes what it takes.
 const QByteArray probe = "a line\nanother\r\nthe last\r";
 
-QString connectAdvice(Failure::Kind kind) {
-    switch (kind) {
+QString tlsAdvice(TlsFault fault) {
+    switch (fault) {
+    case TlsFault::WrongHost:
+        return u"write the host as the certificate names it, or ask the lab for a certificate with this name; if "
+               u"neither "
+               "is wrong, somebody else answers in the lab's place"_s;
+    case TlsFault::Expired:
+        return u"ask the lab for a new certificate; is this machine's clock right?"_s;
+    case TlsFault::NotYetValid:
+        return u"this machine's clock may be wrong: timedatectl set-ntp true"_s;
+    case TlsFault::SelfSigned:
+    case TlsFault::UnknownAuthority:
+        return u"if the certificate is the lab's own, ask the lab for its file and name that with [Server] Ca; else "
+               "install the package ca-certificates, or ask the lab for the whole chain"_s;
+    case TlsFault::NoAuthorities:
+        return u"[Server] Ca has to name a PEM file that the program's user may read"_s;
+    case TlsFault::NotOffered:
+    case TlsFault::DataNotEncrypted:
+        return u"ask the lab whether this server encrypts, and at which port; nothing is sent in plain text instead"_s;
+    case TlsFault::TooOld:
+        return u"ask the lab for TLS 1.2 or newer"_s;
+    case TlsFault::NotTrusted:
+        return u"show this line to the lab"_s;
+    }
+    return {};
+}
+
+QString connectAdvice(const Failure& failure) {
+    if (const auto fault = tlsFaultOf(failure))
+        return tlsAdvice(*fault);
+    switch (failure.kind) {
     case Failure::Kind::Unsupported:
-        return u"the lab's server wants encryption; ask the lab for an account that does without"_s;
+        return u"set [Server] Tls = explicit, or implicit where the lab says so"_s;
     case Failure::Kind::Refused:
         return u"compare [Server] User and Password with what the lab has given out"_s;
     default:
@@ -86,6 +115,8 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
         tell(Good, u"server"_s, u"orders go by HTTP, to the host that was tried above; the FTP server is not tried"_s);
     else
         checkServer(server);
+    if (!m_lab.deployment.TachanaMekomit)
+        checkPlainText();
     return m_good;
 }
 
@@ -196,12 +227,32 @@ void StationCheck::checkHosts() {
         hosts += {"[Mail] Server", lab.mail.host, SmtpPort(lab.mail)};
     for (const Host& host : hosts) {
         const QString key = QString::fromLatin1(host.key);
-        const Result<void> reached = ReachHost(host.address, host.port);
-        if (reached)
+        const Result<void> reached = ReachHost(host.address, host.port, m_lab.deployment.encryption);
+        if (reached) {
             tell(Good, key, u"answers at its port"_s);
-        else
-            tell(Fault, key, reached.failure().message, u"is this machine on line, and is the address right?"_s);
+            continue;
+        }
+        const auto fault = tlsFaultOf(reached.failure());
+        tell(Fault, key, reached.failure().message,
+             fault ? tlsAdvice(*fault) : u"is this machine on line, and is the address right?"_s);
     }
+}
+
+// What anybody on the way to the lab can read.
+void StationCheck::checkPlainText() {
+    const ClientProfile& lab = m_state.profile;
+    const bool byHttp = m_lab.deployment.SugSheliach == Sender::Http;
+    const auto isPlain = [](const QString& address) { return address.startsWith(u"http://"_s, Qt::CaseInsensitive); };
+    QStringList plain;
+    if (byHttp ? isPlain(lab.HttpHost) : m_lab.deployment.encryption.ftp == FtpTls::None)
+        plain += byHttp ? u"orders"_s : u"user, password and orders"_s;
+    if (lab.ReportOn > 0 && (isPlain(lab.ReportUrl) || isPlain(byHttp ? lab.HttpDoneUrl : lab.DoneUrl)))
+        plain += u"reports with the customer's name and telephone"_s;
+    if (plain.isEmpty())
+        tell(Good, u"encryption"_s, u"what goes to the lab is encrypted"_s);
+    else
+        tell(Look, u"encryption"_s, u"in plain text go %1"_s.arg(plain.join(u", "_s)),
+             u"set [Server] Tls and https:// addresses where the lab has them, or take a VPN"_s);
 }
 
 void StationCheck::checkServer(Server server) {
@@ -210,7 +261,7 @@ void StationCheck::checkServer(Server server) {
     const auto connection =
         m_line.connectFtp(lab.FtpServer, lab.FtpUser, lab.FtpPassword, Internet::DataChannel::Passive);
     if (!connection) {
-        tell(Fault, subject, connection.failure().message, connectAdvice(connection.failure().kind));
+        tell(Fault, subject, connection.failure().message, connectAdvice(connection.failure()));
         return;
     }
     tell(Good, subject, u"%1 answers, and takes user and password"_s.arg(lab.FtpServer));

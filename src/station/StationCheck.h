@@ -46,6 +46,7 @@ private:
     void checkDoor();
     void checkClock();
     void checkHosts();
+    void checkPlainText();
     void checkServer(Server server);
     void checkProbe(FtpConnection& connection);
 

@@ -190,6 +190,8 @@ TEST_F(StationCheckTest, WhatLosesOrdersIsAFault) {
         {"a wrong key", [](FakeLab&, QByteArray& file) { file += "Hots = a\n"; }, "FAULT lab.ini: "},
         {"not careful", [](FakeLab&, QByteArray& file) { file.replace("Careful = yes", "Careful = no"); },
          "look guards: "},
+        {"nothing encrypted", [](FakeLab&, QByteArray&) {},
+         "look encryption: in plain text go user, password and orders"},
     };
     const QByteArray good = lab;
     for (const auto& one : cases) {

@@ -28,6 +28,7 @@ using Poco::Net::SocketAddress;
 using Poco::Net::StreamSocket;
 
 constexpr Poco::UInt16 ftpPort = 21;
+constexpr Poco::UInt16 ftpsPort = 990; // encrypted from the first byte on
 // Beyond these a server is not talking FTP.
 constexpr qsizetype longestReply = 64 * 1024;
 constexpr qsizetype longestListing = 16 * 1024 * 1024;
@@ -57,6 +58,14 @@ void sendAll(StreamSocket& socket, const char* bytes, std::size_t count) {
             throw Poco::Net::ConnectionResetException();
         bytes += sent;
         count -= static_cast<std::size_t>(sent);
+    }
+}
+
+// Tells the other side that no more is wanted; whether it hears that changes nothing.
+void endOfLine(StreamSocket& socket) {
+    try {
+        socket.shutdownSend();
+    } catch (const Poco::Exception&) {
     }
 }
 
@@ -117,6 +126,10 @@ template <class Step>
 auto FtpSessionWire::guarded(Step step) -> decltype(step()) {
     try {
         return step();
+    } catch (const TlsRefused& refusal) {
+        const Failure failure = notTrusted(refusal);
+        broken(failure.kind, failure.message);
+        return failure;
     } catch (const Poco::TimeoutException&) {
         return broken(Failure::Kind::TimedOut, u"no answer within the time limit"_s);
     } catch (const Poco::Exception& exception) {
@@ -133,6 +146,8 @@ void FtpSessionWire::close() {
     try {
         m_control.socket.setSendTimeout(Poco::Timespan(1, 0));
         sendAll(m_control.socket, "QUIT\r\n", 6);
+        if (m_control.socket.secure())
+            m_control.socket.shutdownSend();
     } catch (const std::exception&) { // QUIT is not needed on a broken line
     }
     m_control = {};
@@ -204,18 +219,65 @@ Result<void> FtpSessionWire::open(const QString& host, const QString& user, cons
     m_host = host;
     m_channel = channel;
     return guarded([&]() -> Result<void> {
-        m_control = LineSocket(ResolvedAddress(host.toStdString(), ftpPort, m_call), m_call);
+        const Poco::UInt16 usualPort = m_tls == FtpTls::Implicit ? ftpsPort : ftpPort;
+        m_control = LineSocket(ResolvedAddress(host.toStdString(), usualPort, m_call), m_call);
         m_open = true;
         m_control.socket.setNoDelay(true);
+        if (m_tls == FtpTls::Implicit)
+            m_control.encrypt(host.toStdString(), m_call);
         Reply greeting = readReply();
         writeLog(u"ftp connected, %1"_s.arg(greeting.code));
         for (int delays = 0; greeting.code >= 100 && greeting.code < 200 && delays < mostDelays; ++delays)
             greeting = readReply();
-        auto result = completed(greeting.code) ? login(user, password) : refusedLogin(greeting);
+        Result<void> result = completed(greeting.code) ? noFailure() : refusedLogin(greeting);
+        if (result && m_tls == FtpTls::Explicit)
+            result = askForTls();
+        if (result)
+            result = login(user, password);
+        if (result && m_tls != FtpTls::None)
+            result = protectData();
         if (!result)
             close();
         return result;
     });
+}
+
+Failure FtpSessionWire::notTrusted(const TlsRefused& refusal) const {
+    return tlsFailure(refusal.fault(), u"ftp "_s + m_host, QString::fromStdString(refusal.message()));
+}
+
+// Neither user nor password is said before the line is encrypted: a refusal ends the connection.
+Result<void> FtpSessionWire::askForTls() {
+    const Reply reply = ask("AUTH TLS");
+    if (reply.code == 421)
+        return refused(reply);
+    if (!completed(reply.code) && reply.code != 334)
+        return tlsFailure(TlsFault::NotOffered, u"ftp "_s + m_host, AnsiCodePage::decode(reply.text));
+    // What came in the open behind the answer was put there by somebody else.
+    if (!m_received.isEmpty())
+        return tlsFailure(TlsFault::NotTrusted, u"ftp "_s + m_host, u"words in plain text behind the answer"_s);
+    m_control.encrypt(m_host.toStdString(), m_call);
+    return {};
+}
+
+// RFC 4217: without this the files travel in plain text.
+Result<void> FtpSessionWire::protectData() {
+    ask("PBSZ 0");
+    const Reply reply = ask("PROT P");
+    if (reply.code == 421)
+        return refused(reply);
+    return completed(reply.code)
+               ? noFailure()
+               : tlsFailure(TlsFault::DataNotEncrypted, u"ftp "_s + m_host, AnsiCodePage::decode(reply.text));
+}
+
+// Servers want to see that files come from whoever logged in, so the data line resumes the control line's session.
+// Under TLS 1.2 that is the session of its handshake; under TLS 1.3 the newest ticket that came over the control line,
+// each time a copy, as a ticket may be used again. A server that sends none gets a whole handshake, with the same look
+// at its certificate.
+void FtpSessionWire::encryptData(LineSocket& data) {
+    if (m_tls != FtpTls::None)
+        data.encrypt(m_host.toStdString(), m_call, TlsSessionOf(m_control.socket));
 }
 
 Result<void> FtpSessionWire::login(const QString& user, const QString& password) {
@@ -378,15 +440,20 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
     timer.start();
     Result<void> moved;
     try {
+        encryptData(data);
         moved = move(data.socket);
     } catch (const Poco::TimeoutException&) {
         return broken(Failure::Kind::TimedOut, u"the transfer stood still"_s);
+    } catch (const TlsRefused& refusal) {
+        moved = notTrusted(refusal);
     } catch (const Poco::Exception& exception) {
         moved =
             Failure{Failure::Kind::Disconnected,
                     u"ftp %1: the transfer was cut: %2"_s.arg(m_host, QString::fromStdString(exception.displayText()))};
     }
     // Some servers wait for the end of a download's connection before they say that all has gone.
+    if (moved && direction == Direction::Down && data.socket.secure())
+        endOfLine(data.socket);
     if (!moved || direction == Direction::Down)
         data.close();
     if (!moved) {
@@ -407,6 +474,15 @@ Result<void> FtpSessionWire::transfer(const QByteArray& line, Direction directio
     return direction == Direction::Up ? endOfPut(data.socket) : noFailure();
 }
 
+// An encrypted download whose end was not told is whole only if the server tells the same length.
+Result<void> FtpSessionWire::endOfGet(const QString& remoteName, qint64 received) {
+    const auto told = length(remoteName);
+    if (told && *told == received)
+        return {};
+    return Failure{Failure::Kind::Disconnected,
+                   u"ftp %1: the encrypted line ended before its end was told"_s.arg(m_host)};
+}
+
 // A line that was cut behind the last bytes leaves a server that took what it had for the whole and says so.
 Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
     std::array<char, 16> rest;
@@ -415,6 +491,8 @@ Result<void> FtpSessionWire::endOfPut(StreamSocket& data) {
         for (int reads = 0; reads < mostReads && data.receiveBytes(rest.data(), static_cast<int>(rest.size())) > 0;
              ++reads) {
         }
+    } catch (const TlsEndedEarly&) {
+        // It was this side that had to tell the end, and the server has confirmed it over the control line.
     } catch (const Poco::TimeoutException&) {
         // The server keeps the data connection open although it has all bytes; that does no harm.
     } catch (const Poco::Exception&) {
@@ -458,15 +536,23 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
     NewContent content(local, toText(local));
     if (content.failed())
         return content.commit();
+    qint64 taken = 0;
+    bool endIsTold = true;
     auto received = guarded([&] {
         return transfer(
             "RETR " + *name, Direction::Down,
             [&](StreamSocket& data) -> Result<void> {
                 std::vector<char> bytes(chunk);
                 for (;;) {
-                    const int count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
+                    int count = 0;
+                    try {
+                        count = data.receiveBytes(bytes.data(), static_cast<int>(bytes.size()));
+                    } catch (const TlsEndedEarly&) {
+                        endIsTold = false;
+                    }
                     if (count <= 0)
                         return {};
+                    taken += count;
                     m_call.moved(count);
                     content.append(bytes.data(), static_cast<std::size_t>(count));
                     if (content.failed())
@@ -475,6 +561,8 @@ Result<void> FtpSessionWire::get(const QString& remoteName, const HostPath& loca
             },
             type);
     });
+    if (received && !endIsTold)
+        received = endOfGet(remoteName, taken);
     return received ? content.commit() : received;
 }
 

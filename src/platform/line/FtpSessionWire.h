@@ -16,9 +16,10 @@ namespace lumora {
 // Used by one thread at a time; every call blocks.
 class FtpSessionWire {
 public:
-    FtpSessionWire(const LineCall& call, FtpType type)
-        : m_call(call)
-        , m_type(type) {}
+    FtpSessionWire(LineCall call, FtpType type, FtpTls tls)
+        : m_call(std::move(call))
+        , m_type(type)
+        , m_tls(tls) {}
 
     Result<void> open(const QString& host, const QString& user, const QString& password, Internet::DataChannel channel);
     void close();
@@ -52,6 +53,11 @@ private:
     template <class Step>
     auto guarded(Step step) -> decltype(step());
 
+    Failure notTrusted(const TlsRefused& refusal) const;
+    // The control line goes on encrypted, or nothing more is said over it.
+    Result<void> askForTls();
+    Result<void> protectData();
+    void encryptData(LineSocket& data);
     Result<void> login(const QString& user, const QString& password);
     Failure refusedLogin(const Reply& reply);
     // What the server answers to PWD.
@@ -63,10 +69,12 @@ private:
     // Opens a data connection, gives the command, moves the bytes and judges the reply that closes the transfer.
     Result<void> transfer(const QByteArray& line, Direction direction, const Transfer& move,
                           std::optional<FtpType> type = std::nullopt);
+    Result<void> endOfGet(const QString& remoteName, qint64 received);
     Result<void> endOfPut(Poco::Net::StreamSocket& data);
 
     LineCall m_call;
     FtpType m_type;
+    FtpTls m_tls;
     LineSocket m_control;
     QString m_host;
     QByteArray m_received; // bytes behind the reply that was read last

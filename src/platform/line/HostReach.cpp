@@ -1,5 +1,6 @@
 #include "platform/line/HostReach.h"
 
+#include "platform/line/BlockingCall.h"
 #include "platform/line/LineSocket.h"
 
 #include <QUrl>
@@ -10,16 +11,26 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-Result<void> ReachHost(const QString& host, quint16 usualPort, const TimeLimits& limits) {
+constexpr quint16 httpsPort = 443;
+
+Result<void> ReachHost(const QString& host, quint16 usualPort, const LineEncryption& encryption,
+                       const TimeLimits& limits) {
     const QString asked = host.contains(u"://"_s) ? QUrl(host).authority() : host;
     const auto failed = [&](Failure::Kind kind, const QString& reason) {
         return Failure{kind, u"%1: %2"_s.arg(asked, reason)};
     };
     LineAbort line;
-    const LineCall call(limits, line);
+    const LineCall call(limits, line, std::make_shared<TlsTrust>(encryption.authorities));
+    const bool encrypted = host.startsWith(u"https://"_s, Qt::CaseInsensitive);
+    const WithoutBrokenPipeSignal guard;
     try {
-        LineSocket(ResolvedAddress(asked.toStdString(), usualPort, call), call).close();
+        LineSocket socket(ResolvedAddress(asked.toStdString(), encrypted ? httpsPort : usualPort, call), call);
+        if (encrypted)
+            socket.encrypt(asked.toStdString(), call);
+        socket.close();
         return {};
+    } catch (const TlsRefused& refusal) {
+        return tlsFailure(refusal.fault(), asked, QString::fromStdString(refusal.message()));
     } catch (const Poco::TimeoutException&) {
         return failed(Failure::Kind::TimedOut, u"no answer within the time limit"_s);
     } catch (const Poco::Exception& exception) {

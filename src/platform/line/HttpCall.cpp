@@ -32,23 +32,26 @@ constexpr qint64 pieceOfBody = 64 * 1024;
 struct Address {
     std::string host; // with its port, if one is named
     QByteArray target;
+    bool encrypted = false;
+
+    QString scheme() const { return encrypted ? u"https://"_s : u"http://"_s; }
+    Poco::UInt16 usualPort() const { return encrypted ? 443 : 80; }
 };
 
 Result<Address> addressOf(const QString& url) {
-    const QString scheme = u"http://"_s;
-    if (!url.startsWith(scheme, Qt::CaseInsensitive))
-        return callFailure(Failure::Kind::Unsupported, url, u"only http addresses can be called"_s);
-    const QString rest = url.mid(scheme.size());
+    const bool encrypted = url.startsWith(u"https://"_s, Qt::CaseInsensitive);
+    if (!encrypted && !url.startsWith(u"http://"_s, Qt::CaseInsensitive))
+        return callFailure(Failure::Kind::Unsupported, url, u"only http and https addresses can be called"_s);
+    const QString rest = url.mid(encrypted ? 8 : 7);
     qsizetype hostEnd = 0;
     while (hostEnd < rest.size() && !u"/?#"_s.contains(rest[hostEnd]))
         ++hostEnd;
-    Address address{rest.left(hostEnd).toStdString(), HttpTarget(rest.mid(hostEnd))};
+    Address address{rest.left(hostEnd).toStdString(), HttpTarget(rest.mid(hostEnd)), encrypted};
     if (address.host.empty())
         return callFailure(Failure::Kind::Unsupported, url, u"the address names no host"_s);
     return address;
 }
 
-constexpr Poco::UInt16 httpPort = 80;
 constexpr int mostRedirects = 5;
 
 using Request = Poco::Net::HTTPRequest;
@@ -70,18 +73,18 @@ bool isRedirect(int status) {
     return (status >= 301 && status <= 303) || status == 307 || status == 308;
 }
 
-QString hostAndPort(const std::string& host) {
-    const QString text = QString::fromStdString(host).toLower();
-    return text.endsWith(u":80"_s) ? text.chopped(3) : text;
+QString hostAndPort(const Address& address) {
+    const QString usual = u":%1"_s.arg(address.usualPort());
+    const QString text = address.scheme() + QString::fromStdString(address.host).toLower();
+    return text.endsWith(usual) ? text.chopped(usual.size()) : text;
 }
 
-// Where a redirect leads on the same host and port; no value where it leads elsewhere.
+// Where a redirect leads on the same host and port, encrypted as before; no value where it leads elsewhere.
 std::optional<QString> redirectTarget(const Address& from, const QString& location) {
-    const QString scheme = u"http://"_s;
-    const QString host = scheme + QString::fromStdString(from.host);
+    const QString host = from.scheme() + QString::fromStdString(from.host);
     QString url = location.left(location.indexOf(u'#'));
     if (url.startsWith(u"//"_s)) {
-        url.prepend(u"http:"_s);
+        url.prepend(from.scheme().chopped(2));
     } else if (url.startsWith(u'/')) {
         url.prepend(host);
     } else if (!url.contains(u"://"_s)) {
@@ -90,14 +93,16 @@ std::optional<QString> redirectTarget(const Address& from, const QString& locati
         url = host + AnsiCodePage::decode(path.left(path.lastIndexOf('/') + 1)) + url;
     }
     const auto to = addressOf(url);
-    return to && hostAndPort(to->host) == hostAndPort(from.host) ? std::optional(url) : std::nullopt;
+    return to && hostAndPort(*to) == hostAndPort(from) ? std::optional(url) : std::nullopt;
 }
 
 // One request and its answer. The body of a redirect is not taken.
 Result<Answered> askOnce(const QString& url, const Address& to, const Asking& asking, const LineCall& line,
                          const BodySink& sink) {
     try {
-        LineSocket socket(ResolvedAddress(to.host, httpPort, line), line);
+        LineSocket socket(ResolvedAddress(to.host, to.usualPort(), line), line);
+        if (to.encrypted)
+            socket.encrypt(to.host, line);
         Poco::Net::HTTPClientSession session(socket.socket);
         session.setKeepAlive(false);
         Request request(asking.method, to.target.toStdString(), asking.version);
@@ -144,6 +149,8 @@ Result<Answered> askOnce(const QString& url, const Address& to, const Asking& as
         if (asking.method != Request::HTTP_HEAD && received < answer.length.value_or(received))
             return callFailure(Failure::Kind::Disconnected, url, u"the answer was cut short"_s);
         return answer;
+    } catch (const TlsRefused& refusal) {
+        return tlsFailure(refusal.fault(), url, QString::fromStdString(refusal.message()));
     } catch (const Poco::TimeoutException&) {
         return callFailure(Failure::Kind::TimedOut, url, u"no answer within the time limit"_s);
     } catch (const Poco::Exception& exception) {

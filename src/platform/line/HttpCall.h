@@ -26,7 +26,7 @@ struct HttpAnswer {
     bool good() const { return status >= 200 && status <= 299; }
 };
 
-// http only. A body that ends before its announced length is a failure. A redirect to the same host and port is
+// http and https. A body that ends before its announced length is a failure. A redirect to the same host and port is
 // followed, at most five in a row.
 
 // GET past every cache.

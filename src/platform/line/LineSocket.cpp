@@ -6,6 +6,7 @@
 #include <Poco/Net/IPAddress.h>
 #include <Poco/Net/NetException.h>
 
+#include <algorithm>
 #include <chrono>
 #include <condition_variable>
 #include <memory>
@@ -28,6 +29,12 @@ struct NameAnswer {
 
 constexpr auto lookAtAbort = std::chrono::milliseconds(50);
 
+// The place of the colon before a port; npos without one.
+std::size_t portSign(const std::string& host) {
+    const std::size_t bracket = host.rfind(']');
+    return host.find(':', bracket == std::string::npos ? 0 : bracket);
+}
+
 } // namespace
 
 void LineCall::check() const {
@@ -35,12 +42,14 @@ void LineCall::check() const {
         throw Poco::Net::ConnectionAbortedException("the sending was stopped");
 }
 
+std::string HostWithoutPort(const std::string& host) {
+    const std::string name = host.substr(0, portSign(host));
+    return !name.empty() && name.front() == '[' && name.back() == ']' ? name.substr(1, name.size() - 2) : name;
+}
+
 SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, const LineCall& call) {
-    const std::size_t bracket = host.rfind(']');
-    const std::size_t colon = host.find(':', bracket == std::string::npos ? 0 : bracket);
-    std::string name = host.substr(0, colon);
-    if (!name.empty() && name.front() == '[' && name.back() == ']')
-        name = name.substr(1, name.size() - 2);
+    const std::size_t colon = portSign(host);
+    const std::string name = HostWithoutPort(host);
     const std::string port = colon == std::string::npos ? std::to_string(usualPort) : host.substr(colon + 1);
     Poco::Net::IPAddress numeric;
     if (Poco::Net::IPAddress::tryParse(name, numeric))
@@ -89,6 +98,13 @@ LineSocket::LineSocket(const SocketAddress& address, const LineCall& call)
     call.check();
     socket.setReceiveTimeout(call.limits().silence);
     socket.setSendTimeout(call.limits().silence);
+}
+
+void LineSocket::encrypt(const std::string& host, const LineCall& call, const TlsSession& resumed) {
+    call.check();
+    socket = EncryptedSocket(socket, HostWithoutPort(host), call.trust(),
+                             std::min(call.limits().connect, call.limits().silence), resumed);
+    call.check();
 }
 
 void LineSocket::close() {

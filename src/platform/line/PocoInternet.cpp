@@ -15,6 +15,7 @@ namespace lumora {
 using namespace Qt::StringLiterals;
 struct PocoInternet::Line {
     LineAbort abort;
+    std::shared_ptr<const TlsTrust> trust;
     EventPump* pump = nullptr;
 };
 
@@ -79,12 +80,19 @@ private:
 
 } // namespace
 
-PocoInternet::PocoInternet(TimeLimits limits, FtpType type)
+PocoInternet::PocoInternet(TimeLimits limits, FtpType type, const LineEncryption& encryption)
     : m_limits(limits)
     , m_type(type)
-    , m_line(std::make_shared<Line>()) {}
+    , m_tls(encryption.ftp)
+    , m_line(std::make_shared<Line>()) {
+    m_line->trust = std::make_shared<TlsTrust>(encryption.authorities);
+}
 
 PocoInternet::~PocoInternet() = default;
+
+LineCall PocoInternet::call() const {
+    return {m_limits, m_line->abort, m_line->trust};
+}
 
 void PocoInternet::abort() {
     m_line->abort.abort();
@@ -115,7 +123,7 @@ bool PocoInternet::connectedState() const {
 Result<std::unique_ptr<FtpConnection>> PocoInternet::connectFtp(const QString& host, const QString& user,
                                                                 const QString& password, DataChannel channel) {
     const auto line = m_line;
-    const auto wire = std::make_shared<FtpSessionWire>(LineCall(m_limits, line->abort), m_type);
+    const auto wire = std::make_shared<FtpSessionWire>(call(), m_type, m_tls);
     const auto opened = RunBlocking([&] { return wire->open(host, user, password, channel); }, line->pump);
     if (!opened)
         return opened.failure();
@@ -144,18 +152,18 @@ Result<WebAnswer> answerOf(EventPump* pump, Call call) {
 } // namespace
 
 Result<WebAnswer> PocoInternet::fetch(const QString& url) {
-    const LineCall line(m_limits, m_line->abort);
+    const LineCall line = call();
     return answerOf(m_line->pump, [&](const BodySink& sink) { return HttpGet(url, line, sink); });
 }
 
 Result<WebAnswer> PocoInternet::post(const QString& url, const PostRequest& request) {
-    const LineCall line(m_limits, m_line->abort);
+    const LineCall line = call();
     return answerOf(m_line->pump, [&](const BodySink& sink) { return HttpPost(url, request, line, sink); });
 }
 
 Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {
     using Length = std::optional<qint64>;
-    const LineCall line(m_limits, m_line->abort);
+    const LineCall line = call();
     return RunBlocking(
         [&]() -> Result<Length> {
             const auto answer = HttpHead(url, line);
@@ -174,7 +182,7 @@ Result<std::optional<qint64>> PocoInternet::contentLength(const QString& url) {
 }
 
 Result<void> PocoInternet::download(const QString& url, const HostPath& target) {
-    const LineCall line(m_limits, m_line->abort);
+    const LineCall line = call();
     return RunBlocking(
         [&]() -> Result<void> {
             NewContent content(target, toText(target));

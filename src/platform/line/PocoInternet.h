@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/line/Encryption.h"
 #include "platform/line/FtpSessionWire.h"
 #include "platform/line/Internet.h"
 
@@ -8,7 +9,7 @@ namespace lumora {
 // The line of the running program.
 class PocoInternet : public Internet {
 public:
-    explicit PocoInternet(TimeLimits limits = {}, FtpType type = FtpType::Ascii);
+    explicit PocoInternet(TimeLimits limits = {}, FtpType type = FtpType::Ascii, const LineEncryption& encryption = {});
     ~PocoInternet() override;
 
     bool open() override { return connectedState(); }
@@ -28,8 +29,11 @@ public:
     struct Line;
 
 private:
+    LineCall call() const;
+
     TimeLimits m_limits;
     FtpType m_type;
+    FtpTls m_tls;
     std::shared_ptr<Line> m_line;
 };
 

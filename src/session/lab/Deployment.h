@@ -2,6 +2,7 @@
 
 #include "common/DoorRules.h"
 #include "common/KioskRules.h"
+#include "platform/line/Encryption.h"
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
 
@@ -17,8 +18,9 @@ struct Deployment {
     ClientProfile profile;
 
     FtpType ftpType = FtpType::Ascii; // only the FTP line uses it; dwType is 1 with both
-    bool keptFtpSession = false;      // one session a pass; else one a file
-    int ftpLines = 1;                 // with a kept session: connections that files go by at once
+    LineEncryption encryption;
+    bool keptFtpSession = false; // one session a pass; else one a file
+    int ftpLines = 1;            // with a kept session: connections that files go by at once
     Sender SugSheliach = Sender::Ftp;
     std::int16_t HaKoopon = 0;
     std::int16_t DeliveryChoiceMode = 0;

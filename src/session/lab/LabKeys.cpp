@@ -34,6 +34,11 @@ auto at(T KioskRules::*field) {
 }
 
 template <class T>
+auto at(T LineEncryption::*field) {
+    return [field](D& d) -> T& { return d.encryption.*field; };
+}
+
+template <class T>
 auto at(T MailAccount::*field) {
     return [field](D& d) -> T& { return d.profile.mail.*field; };
 }
@@ -66,7 +71,8 @@ Kind shortText(Where where) {
 
 template <class Where>
 Kind script(Where where) {
-    return text(where, u"an address that begins with http://, without ? and #"_s, u"http://[^\\s?#/]+/[^\\s?#]+"_s);
+    return text(where, u"an address that begins with http:// or https://, without ? and #"_s,
+                u"https?://[^\\s?#/]+/[^\\s?#]+"_s);
 }
 
 template <class Where>
@@ -185,6 +191,13 @@ std::vector<Row> rows() {
          text(at(&P::FtpFolder2), u"one folder name without / \\ ^, not empty"_s, u"(?!\\.{1,2}$)[^^/\\\\]{1,80}"_s)},
         {"Server", "Type",
          words<FtpType>(at(&D::ftpType), u"A or I"_s, {{u"A"_s, FtpType::Ascii}, {u"I"_s, FtpType::Image}})},
+        {"Server", "Tls",
+         words<FtpTls>(
+             at(&LineEncryption::ftp), u"none, explicit or implicit"_s,
+             {{u"none"_s, FtpTls::None}, {u"explicit"_s, FtpTls::Explicit}, {u"implicit"_s, FtpTls::Implicit}})},
+        {"Server", "Ca",
+         text(at(&LineEncryption::authorities), u"the whole path of a file, beginning with /, or empty"_s,
+              u"(?s)(/.*)?"_s)},
         {"Server", "Session",
          words<bool>(at(&D::keptFtpSession), u"each or kept"_s, {{u"each"_s, false}, {u"kept"_s, true}})},
         {"Server", "Lines", number(at(&D::ftpLines), 1, 4)},
@@ -216,8 +229,8 @@ std::vector<Row> rows() {
         {"Addresses", "Done", script(at(&P::DoneUrl))},
         {"Addresses", "HttpDone", script(at(&P::HttpDoneUrl))},
         {"Addresses", "HttpHost",
-         text(at(&P::HttpHost), u"a host with http:// in front and no slash behind it, or empty"_s,
-              u"(http://([A-Za-z0-9._-]+|\\[[0-9A-Fa-f:.]+\\])(:[0-9]{1,5})?)?"_s)},
+         text(at(&P::HttpHost), u"a host with http:// or https:// in front and no slash behind it, or empty"_s,
+              u"(https?://([A-Za-z0-9._-]+|\\[[0-9A-Fa-f:.]+\\])(:[0-9]{1,5})?)?"_s)},
         {"Addresses", "HttpTikiya",
          text(at(&P::HttpTikiya), u"folder names parted by /, with no slash at either end, or empty"_s,
               u"([^\\s?#/]+(/[^\\s?#/]+)*)?"_s)},

@@ -1,16 +1,60 @@
 #include "transfer/delivery/LineTrouble.h"
 
+#include "platform/line/Encryption.h"
 #include "session/SessionState.h"
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+// What is said is for the shop, which can mend it or knows whom to call.
+QString encryptionTrouble(const SessionState& state, TlsFault fault) {
+    const auto told = [&](const QString& hebrew, const QString& english) {
+        return state.wording(hebrew + u" לכן לא ניתן לשלוח אליו. יש להודיע על כך לחנות."_s,
+                             english + u" So nothing can be sent to it. Please tell the shop."_s);
+    };
+    switch (fault) {
+    case TlsFault::WrongHost:
+        return told(u"תעודת האבטחה של השרת שייכת לשרת אחר, וייתכן שזה אינו השרת של המעבדה."_s,
+                    u"The server's certificate belongs to another server; this may not be the lab's server."_s);
+    case TlsFault::Expired:
+        return told(u"תוקף תעודת האבטחה של השרת פג."_s, u"The server's certificate has expired."_s);
+    case TlsFault::NotYetValid:
+        return told(u"תעודת האבטחה של השרת עדיין אינה בתוקף. ייתכן שהשעון של מחשב זה אינו נכון."_s,
+                    u"The server's certificate is not valid yet. This computer's clock may be wrong."_s);
+    case TlsFault::SelfSigned:
+        return told(u"השרת חתם בעצמו על תעודת האבטחה שלו, ולא ידוע אם זה השרת של המעבדה."_s,
+                    u"The server has signed its certificate itself, so it is not known whether it is the lab's."_s);
+    case TlsFault::UnknownAuthority:
+    case TlsFault::NotTrusted:
+        return told(u"מחשב זה אינו מכיר את מי שחתם על תעודת האבטחה של השרת, או שהתעודה פגומה."_s,
+                    u"This computer does not know who has signed the server's certificate, or the certificate is not "
+                    u"good."_s);
+    case TlsFault::NoAuthorities:
+        return told(u"לא ניתן לקרוא במחשב זה את קובץ תעודות האבטחה של המעבדה."_s,
+                    u"The file with the lab's certificates can't be read on this computer."_s);
+    case TlsFault::NotOffered:
+    case TlsFault::DataNotEncrypted:
+        return told(u"כאן הוגדר חיבור מוצפן, והשרת של המעבדה אינו מציע חיבור כזה."_s,
+                    u"Encryption is set up here, and the lab's server does not offer it."_s);
+    case TlsFault::TooOld:
+        return told(u"ההצפנה שהשרת של המעבדה מציע ישנה מדי."_s,
+                    u"The encryption that the lab's server offers is too old."_s);
+    }
+    return {};
+}
+
+} // namespace
+
 // When to try again is said once, by the advice of the phase.
 QString LineTroubleText(const SessionState& state, LineStep step, const Failure& failure, const QString& subject) {
     const bool answered = failure.kind == Failure::Kind::Refused || failure.kind == Failure::Kind::AccessDenied;
     // Isolating marks: the name may run in the other direction than the sentence.
     const QString name = QChar(0x2068) + subject + QChar(0x2069);
+    if (const auto fault = tlsFaultOf(failure))
+        return encryptionTrouble(state, *fault);
     switch (step) {
     case LineStep::Open:
         return state.wording(u"למחשב אין קשר לאינטרנט. יש לבדוק את החיבור ולנסות שוב."_s,
@@ -18,9 +62,8 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
     case LineStep::Connect:
         if (failure.kind == Failure::Kind::Unsupported)
             return state.wording(
-                u"השרת של המעבדה דורש חיבור מוצפן, ולתוכנה זו אין חיבור כזה. יש להודיע על כך לחנות."_s,
-                u"The lab's server wants encryption, which this program does not have. Please tell the "
-                u"shop."_s);
+                u"השרת של המעבדה דורש חיבור מוצפן, וחיבור כזה לא הוגדר כאן. יש להודיע על כך לחנות."_s,
+                u"The lab's server wants encryption, which is not set up here. Please tell the shop."_s);
         if (answered)
             return state.wording(u"השרת סירב לכניסה: ייתכן ששם המשתמש או הסיסמה שגויים, או שהשרת עמוס. "
                                  u"אפשר לנסות שוב או להודיע לחנות."_s,

@@ -521,10 +521,7 @@ bool HttpSender::HttpSendDone(const QString& query) const {
 }
 
 void HttpSender::postTestPicture() {
-    const QString& host = m_state.profile.HttpHost;
-    const QString scheme = u"://"_s;
-    const QString bare = host.contains(scheme) ? host.mid(host.indexOf(scheme) + scheme.size()) : host;
-    lists.TxtWeb = m_script.MultipartPostInet(testFolder, {u"4445.png"_s}, bare,
+    lists.TxtWeb = m_script.MultipartPostInet(testFolder, {u"4445.png"_s}, m_state.profile.HttpHost,
                                               m_state.profile.HttpScriptPath + u"getfile2.php"_s,
                                               WorkspacePaths::root(m_state), lists.TxtUrl);
 }

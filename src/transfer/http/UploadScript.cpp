@@ -104,7 +104,8 @@ QString UploadScript::MultipartPostInet(const QString& folderName, const QString
         request.contentType = QByteArray("multipart/form-data, boundary=") + boundary;
         request.body = std::move(*body);
         request.announcedLength = 2 * request.body.size() - 1;
-        const auto answer = m_platform.internet.post(u"http://"_s + server + address(url, folderName, extra), request);
+        const auto answer = m_platform.internet.post(
+            (server.contains(u"://"_s) ? server : u"http://"_s + server) + address(url, folderName, extra), request);
         m_refused = answer && !answer->good();
         if (answer)
             return AnsiCodePage::decode(answer->body);

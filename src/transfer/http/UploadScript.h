@@ -38,8 +38,8 @@ public:
                           const QString& password);
 
     // The form of the page's test button: HTTP/1.0, a comma in the content type, and an announced length of twice the
-    // body's less one, filled with zeros. server is the host alone, url the path on it. Gives the answer's text, or
-    // "Error: " and the reason.
+    // body's less one, filled with zeros. server is a host, with its scheme where that is not http; url is the path on
+    // it. Gives the answer's text, or "Error: " and the reason.
     QString MultipartPostInet(const QString& folderName, const QStringList& files, const QString& server,
                               const QString& url, const DrivePath& localFolder, const QString& extra);
 

@@ -45,6 +45,8 @@ HostPath write(const QTemporaryDir& folder, const char* name, const QByteArray& 
 
 // Host, user, password and folder of a running server; tests/matrix/run gives each of its own.
 constexpr const char* givenServer = "LUMORA_FTP_SERVER";
+// A PEM file of authorities where that server encrypts.
+constexpr const char* givenAuthorities = "LUMORA_FTP_CA";
 
 struct Lab {
     enum class Server { Fake, Lab, Given };
@@ -95,7 +97,9 @@ protected:
 
     QTemporaryDir local;
     FakeLab fake;
-    PocoInternet internet{TimeLimits(), GetParam().type};
+    QString authorities = GetParam().server == Lab::Server::Given ? qEnvironmentVariable(givenAuthorities) : QString();
+    PocoInternet internet{
+        TimeLimits(), GetParam().type, {authorities.isEmpty() ? FtpTls::None : FtpTls::Explicit, authorities}};
     std::optional<LabServers> labServers;
     QStringList login;
     HostPath account;
