@@ -157,12 +157,19 @@ PROFTPD = """ServerName,lab ServerType,standalone DefaultAddress,127.0.0.1 Socke
 UseReverseDNS,off User,daemon Group,daemon PidFile,{scratch}/pid ScoreboardFile,{scratch}/score MaxInstances,30
 AuthOrder,mod_auth_file.c AuthUserFile,{scratch}/passwd AuthGroupFile,{scratch}/group RequireValidShell,off DefaultRoot,~
 AllowOverwrite,on WtmpLog,off DelayEngine,off SystemLog,{scratch}/log"""
+# Encrypted lines alone; the data lines have to be of the login's session where the server can ask for that.
+ENCRYPTED = {'vsftpd': """ ssl_enable=YES allow_anon_ssl=YES force_anon_logins_ssl=YES force_anon_data_ssl=YES require_ssl_reuse=YES
+rsa_cert_file={tls} rsa_private_key_file={tls} pasv_min_port={first} pasv_max_port={last}""",
+             'proftpd': """ ModulePath,{unpacked}/usr/lib/proftpd LoadModule,mod_tls.c TLSEngine,on TLSRequired,on PassivePorts,{first},{last}
+TLSRSACertificateFile,{tls} TLSRSACertificateKeyFile,{tls} TLSLog,{scratch}/tls.log""",
+             'pure-ftpd': '-Y 3 -2 {tls} -p {first}:{last}'}
 
 
 class RealFtp:
     """vsftpd, proftpd or pure-ftpd as a Debian package has it, one for each case."""
 
-    def __init__(self, kind, folder, scratch, unpacked, crypt, keeps_bytes):
+    def __init__(self, kind, folder, scratch, unpacked, crypt, keeps_bytes, tls=None, ports=(0, 0)):
+        """tls: a PEM file with key and certificates; then every line is encrypted, and data lines are on these ports."""
         self.root = folder
         # vsftpd lets users in whom it does not know by this name only, pure-ftpd takes it for nobody's.
         self.user = 'ftp' if kind == 'vsftpd' else 'lab'
@@ -179,8 +186,9 @@ class RealFtp:
         for _ in range(5):
             listener, self.port = listen()
             listener.close()
-            names = dict(port=self.port, scratch=scratch, root=folder)
+            names = dict(port=self.port, scratch=scratch, root=folder, tls=tls, unpacked=unpacked, first=ports[0], last=ports[1])
             options = PROFTPD + (' TransferOptions,IgnoreASCII' if keeps_bytes else '') if kind == 'proftpd' else VSFTPD
+            options += ENCRYPTED[kind] if tls and kind != 'pure-ftpd' else ''
             configuration = '\n'.join(options.format(**names).split()).replace(',', ' ')
             (scratch / 'conf').write_text(configuration + '\n')
             if kind == 'vsftpd':
@@ -192,7 +200,8 @@ class RealFtp:
                 subprocess.run([f'{unpacked}/usr/bin/pure-pw', 'mkdb', scratch / 'users.pdb', '-f', scratch / 'users'],
                                check=True, env=environment)
                 command = [f'{unpacked}/usr/sbin/pure-ftpd', '-S', f'127.0.0.1,{self.port}', '-l', f'puredb:{scratch}/users.pdb',
-                           '-H', '-u', '1', '-c', '30', '-C', '30', '-g', scratch / 'pid']
+                           '-H', '-u', '1', '-c', '30', '-C', '30', '-g', scratch / 'pid',
+                           *(ENCRYPTED[kind].format(**names).split() if tls else ())]
             with open(scratch / 'out', 'wb') as out:
                 self.process = subprocess.Popen(command, stdout=out, stderr=out, env=environment, start_new_session=True)
             if self.answers():
