@@ -78,6 +78,13 @@ TEST_F(PictureFileTest, everyKindOfJpegShowsAndScalesTheSamePicture) {
             const fs::path path = write("one.jpg", jpegOfKind(original, kind));
             ASSERT_EQ(take(readPictureSize(path)), size);
             const QByteArray print = take(scalePictureToJpeg(path, third, 95));
+            SmallCopy small{{53, 40}};
+            EXPECT_EQ(take(scalePictureToJpeg(path, third, 95, nullptr, &small)), print);
+            const bool madeOfPixels = kind.colours >= Colours::Rgb;
+            EXPECT_EQ(small.pixels.isNull(), madeOfPixels) << "it would take a decode of its own";
+            if (!madeOfPixels) {
+                EXPECT_LT(meanDifference(small.pixels, take(loadPictureScaled(path, small.size))), 0.4);
+            }
             EXPECT_EQ(print.at(print.indexOf("\xFF\xC0") + 9), 3) << "components";
             EXPECT_EQ(jpegQuality(print), 95);
             const Result<Bitmap> made[] = {loadPicture(path), loadPictureScaled(path, third),

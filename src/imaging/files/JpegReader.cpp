@@ -37,7 +37,7 @@ void convertInks(const unsigned char* inks, QRgb* line, int width, bool inverted
 struct JpegReader::State {
     struct Source {
         jpeg_source_mgr manager{};
-        const PictureInput* input = nullptr;
+        PictureInput* input = nullptr;
         int readError = 0;
         std::array<JOCTET, 65536> buffer;
     };
@@ -219,6 +219,17 @@ bool JpegReader::hasPlanes() const {
     return m_state->info.jpeg_color_space == JCS_YCbCr || m_state->info.jpeg_color_space == JCS_GRAYSCALE;
 }
 
+std::int64_t JpegReader::heldCoefficients() const {
+    State& s = *m_state;
+    std::int64_t bytes = 0;
+    if (jpeg_has_multiple_scans(&s.info) == FALSE)
+        return 0;
+    for (int i = 0; i < s.info.num_components; ++i)
+        bytes += std::int64_t{s.info.comp_info[i].width_in_blocks} * s.info.comp_info[i].height_in_blocks *
+                 std::int64_t{sizeof(JBLOCK)};
+    return bytes;
+}
+
 Result<void> JpegReader::readPlanes(int denominator, PlaneTaker& taker) {
     State& s = *m_state;
     const bool raw = hasPlanes();
@@ -244,6 +255,8 @@ Result<void> JpegReader::readRawPlanes(PlaneTaker& taker) {
         plane.pitchY = shrunk * s.info.max_v_samp_factor / component.v_samp_factor;
         plane.rowsAtOnce = component.v_samp_factor * component.DCT_scaled_size;
         plane.rowBytes = static_cast<int>(component.width_in_blocks) * component.DCT_scaled_size;
+        plane.block = component.DCT_scaled_size;
+        plane.meanStep = component.quant_table != nullptr ? component.quant_table->quantval[0] : 0;
         planes.push_back(plane);
         rows.emplace_back(static_cast<std::size_t>(plane.rowsAtOnce));
     }

@@ -6,6 +6,7 @@
 #include "imaging/files/PictureInput.h"
 #include "imaging/scaling/Planes.h"
 
+#include <cstdint>
 #include <memory>
 
 namespace lumora {
@@ -36,6 +37,9 @@ public:
     // True when the file stores luma and chroma planes, or luma alone; readPlanes gives them as stored. For other
     // pictures (RGB, inks) readPlanes converts pixels, which takes longer.
     bool hasPlanes() const;
+
+    // Bytes in which a decode keeps the whole picture, since its scans follow each other: 0 for most files.
+    std::int64_t heldCoefficients() const;
 
     // The picture as luma and chroma planes, row by row; denominator as in readBitmap.
     Result<void> readPlanes(int denominator, PlaneTaker& taker);

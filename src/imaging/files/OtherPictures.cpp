@@ -3,9 +3,11 @@
 #include "common/HostFile.h"
 
 #include <QBuffer>
+#include <QFile>
 #include <QImageReader>
 #include <QtEndian>
 
+#include <algorithm>
 #include <cerrno>
 #include <mutex>
 
@@ -15,8 +17,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-Result<QByteArray> readAll(const PictureInput& input) {
-    QByteArray bytes(input.size(), Qt::Uninitialized);
+Result<QByteArray> readBytes(PictureInput& input, std::int64_t count) {
+    QByteArray bytes(count, Qt::Uninitialized);
     qsizetype filled = 0;
     while (filled < bytes.size()) {
         const std::ptrdiff_t got = input.read(bytes.data() + filled, static_cast<std::size_t>(bytes.size() - filled));
@@ -32,7 +34,7 @@ Result<QByteArray> readAll(const PictureInput& input) {
 
 // Qt's reader of BMP files takes an absurd size for damage, and takes a file that is cut short for whole, the rest
 // black; both are checked here.
-Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
+Result<void> checkBmp(PictureInput& input, const QByteArray& bytes) {
     constexpr qsizetype headers = 14 + 40;
     const auto* data = reinterpret_cast<const uchar*>(bytes.constData());
     const bool oldHeader = bytes.size() >= 18 && qFromLittleEndian<quint32>(data + 14) == 12;
@@ -52,28 +54,34 @@ Result<void> checkBmp(const PictureInput& input, const QByteArray& bytes) {
         return bounds;
     const bool runLengths =
         compression == 1 || compression == 2; // the header does not tell the length of compressed rows
-    if (!runLengths && offset + (width * bits + 31) / 32 * 4 * height > bytes.size())
+    if (!runLengths && offset + (width * bits + 31) / 32 * 4 * height > input.size())
         return cutShort();
     return {};
 }
 
+// Of a BMP file, which may have 150 MB, only the headers are read ahead; Qt takes the rows from the file one by one.
 template <class Value, class Use>
-Result<Value> withReader(const PictureInput& input, const Use& use) {
+Result<Value> withReader(PictureInput& input, const Use& use) {
     // checkPictureBounds refuses what is too large; Qt's limit of 128 MiB would refuse good pictures.
     static std::once_flag limitLifted;
     std::call_once(limitLifted, [] { QImageReader::setAllocationLimit(0); });
 
-    auto bytes = readAll(input);
+    constexpr std::int64_t headers = 4096;
+    const bool bmp = input.format() == PictureInput::Format::Bmp;
+    auto bytes = readBytes(input, bmp ? std::min(headers, input.size()) : input.size());
     if (!bytes)
         return bytes.failure();
-    const bool bmp = input.format() == PictureInput::Format::Bmp;
+    QBuffer buffer(&*bytes);
+    QFile file;
     if (bmp) {
         if (auto checked = checkBmp(input, *bytes); !checked)
             return checked.failure();
+        if (!file.open(input.descriptor(), QIODevice::ReadOnly) || !file.seek(0))
+            return fileFailure(input.path(), u"can't be read"_s, errno);
+    } else {
+        buffer.open(QIODevice::ReadOnly);
     }
-    QBuffer buffer(&*bytes);
-    buffer.open(QIODevice::ReadOnly);
-    QImageReader reader(&buffer, bmp ? "bmp" : "png");
+    QImageReader reader(bmp ? static_cast<QIODevice*>(&file) : &buffer, bmp ? "bmp" : "png");
     reader.setAutoTransform(false);
     const QSize size = reader.size();
     if (!size.isValid())
@@ -85,13 +93,13 @@ Result<Value> withReader(const PictureInput& input, const Use& use) {
 
 } // namespace
 
-Result<PictureSize> readOtherPictureSize(const PictureInput& input) {
+Result<PictureSize> readOtherPictureSize(PictureInput& input) {
     return withReader<PictureSize>(input, [](QImageReader& reader) -> Result<PictureSize> {
         return PictureSize{reader.size().width(), reader.size().height()};
     });
 }
 
-Result<Bitmap> readOtherPicture(const PictureInput& input) {
+Result<Bitmap> readOtherPicture(PictureInput& input) {
     return withReader<Bitmap>(input, [&input](QImageReader& reader) -> Result<Bitmap> {
         QImage image = reader.read();
         if (image.isNull())

@@ -8,7 +8,7 @@
 namespace lumora {
 
 // BMP and PNG files, read as the format that PictureInput found in the content. Transparency is kept.
-Result<PictureSize> readOtherPictureSize(const PictureInput& input);
-Result<Bitmap> readOtherPicture(const PictureInput& input);
+Result<PictureSize> readOtherPictureSize(PictureInput& input);
+Result<Bitmap> readOtherPicture(PictureInput& input);
 
 } // namespace lumora

@@ -39,17 +39,20 @@ struct Wanted {
 };
 using SizeRule = std::function<Wanted(PictureSize)>;
 
+Result<Bitmap> readScaled(PictureInput input, const SizeRule& wantedFor) {
+    auto reader = JpegReader::open(std::move(input));
+    if (!reader)
+        return reader.failure();
+    const Wanted wanted = wantedFor((*reader)->size());
+    return readResampledPart(**reader, wanted.size, wanted.part);
+}
+
 Result<Bitmap> loadScaled(const std::filesystem::path& path, const SizeRule& wantedFor) try {
     auto input = PictureInput::open(path);
     if (!input)
         return input.failure();
-    if (input->format() == PictureInput::Format::Jpeg) {
-        auto reader = JpegReader::open(std::move(*input));
-        if (!reader)
-            return reader.failure();
-        const Wanted wanted = wantedFor((*reader)->size());
-        return readResampledPart(**reader, wanted.size, wanted.part);
-    }
+    if (input->format() == PictureInput::Format::Jpeg)
+        return readScaled(std::move(*input), wantedFor);
     auto whole = readOtherPicture(*input);
     if (!whole)
         return whole.failure();
@@ -76,6 +79,25 @@ Result<PictureSize> readPictureSize(const std::filesystem::path& path) {
     return (*reader)->size();
 }
 
+std::int64_t decodingMemory(const std::filesystem::path& path, Decode decode) {
+    constexpr std::int64_t rows = 8 << 20;
+    auto input = PictureInput::open(path);
+    if (!input)
+        return rows;
+    const auto bitmap = [](PictureSize size) { return std::int64_t{4} * size.width * size.height; };
+    if (input->format() == PictureInput::Format::Bmp)
+        return rows + input->size() / 3 * 4; // most hold three bytes a pixel
+    if (input->format() == PictureInput::Format::Png) {
+        const auto size = readOtherPictureSize(*input);
+        return rows + input->size() + (size ? 2 * bitmap(*size) : 0); // as it is, and on white
+    }
+    auto reader = JpegReader::open(std::move(*input));
+    if (!reader)
+        return rows;
+    const bool whole = decode == Decode::Whole || !(*reader)->hasPlanes();
+    return rows + (*reader)->heldCoefficients() + (whole ? bitmap((*reader)->size()) : 0);
+}
+
 Result<Bitmap> loadPicture(const std::filesystem::path& path) {
     auto input = PictureInput::open(path);
     if (!input)
@@ -100,6 +122,15 @@ Result<Bitmap> loadPicturePart(const std::filesystem::path& path, PictureSize si
     if (auto bounds = checkPictureBounds(path, part.width(), part.height()); !bounds)
         return bounds.failure();
     return loadScaled(path, [&](PictureSize) { return Wanted(size, part); });
+}
+
+Result<Bitmap> scaledFromJpeg(const QByteArray& file, int width) try {
+    return readScaled(PictureInput::ofJpeg(file), [width](PictureSize size) {
+        const double height = static_cast<double>(width) * size.height / size.width;
+        return Wanted({width, std::max(1, static_cast<int>(RoundHalfEven(height)))});
+    });
+} catch (const std::bad_alloc&) {
+    return memoryIsShort({});
 }
 
 PictureSize smallPictureSize(PictureSize picture, int cell) {
@@ -145,7 +176,7 @@ Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, 
 }
 
 Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
-                                      PictureTimes* times) try {
+                                      PictureTimes* times, SmallCopy* small) try {
     Stopwatch watch(times);
     if (auto bounds = checkPictureBounds(source, size.width, size.height); !bounds)
         return bounds.failure();
@@ -154,12 +185,14 @@ Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, Pictu
         return input.failure();
     if (input->format() == PictureInput::Format::Jpeg) {
         auto reader = JpegReader::open(std::move(*input));
-        return reader ? readResampledToJpeg(**reader, size, quality, bestKernels(), times) : reader.failure();
+        return reader ? readResampledToJpeg(**reader, size, quality, bestKernels(), times, small) : reader.failure();
     }
     auto whole = readOtherPicture(*input);
     if (!whole)
         return whole.failure();
     watch.add(&PictureTimes::decode);
+    if (small != nullptr)
+        small->pixels = resampled(*whole, small->size);
     const Bitmap scaled = resampled(onWhite(*whole), size);
     watch.add(&PictureTimes::draw);
     if (scaled.isNull())

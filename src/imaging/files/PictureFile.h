@@ -6,6 +6,7 @@
 #include <QByteArray>
 #include <QRect>
 
+#include <cstdint>
 #include <filesystem>
 #include <vector>
 
@@ -31,6 +32,11 @@ struct PictureTimes {
 // Reads the header alone.
 Result<PictureSize> readPictureSize(const std::filesystem::path& path);
 
+// About how many bytes of memory a decode takes, by the header: Rows, where it is scaled row by row if the file allows
+// it, Whole, where all of its pixels are kept. Little for a file that can't be read.
+enum class Decode { Rows, Whole };
+std::int64_t decodingMemory(const std::filesystem::path& path, Decode decode);
+
 Result<Bitmap> loadPicture(const std::filesystem::path& path);
 
 // The picture resampled to exactly size (the caller keeps the proportions), with a scaled decode where that loses no
@@ -39,6 +45,9 @@ Result<Bitmap> loadPictureScaled(const std::filesystem::path& path, PictureSize 
 
 // The same picture, of which only part is made. part may reach beyond the picture, where the edge is repeated.
 Result<Bitmap> loadPicturePart(const std::filesystem::path& path, PictureSize size, const QRect& part);
+
+// The picture of a JPEG file that lies in memory, scaled to a width; the height keeps the proportion.
+Result<Bitmap> scaledFromJpeg(const QByteArray& file, int width);
 
 // The size of the small picture in a square cell of cell pixels: the longer side fills the cell, the other keeps the
 // proportion and is at least 1.
@@ -54,9 +63,16 @@ Result<QByteArray> encodeJpeg(const Bitmap& picture, int quality);
 // The same written to path, whole or not at all.
 Result<void> saveJpeg(const Bitmap& picture, const std::filesystem::path& path, int quality);
 
+// A small picture that is wanted out of the decode of a larger one: as loadPictureScaled() makes it, but for the last
+// rounding. The pixels stay null where the file would need a decode of its own for it.
+struct SmallCopy {
+    PictureSize size;
+    Bitmap pixels = {};
+};
+
 // The picture at source, scaled to exactly size on white, as the bytes of a JPEG file: the content of a plain print. It
 // changes no state, so that the next picture of an order can be prepared on another thread.
 Result<QByteArray> scalePictureToJpeg(const std::filesystem::path& source, PictureSize size, int quality,
-                                      PictureTimes* times = nullptr);
+                                      PictureTimes* times = nullptr, SmallCopy* small = nullptr);
 
 } // namespace lumora

@@ -2,6 +2,7 @@
 
 #include "common/HostFile.h"
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <cstring>
@@ -68,9 +69,18 @@ Result<PictureInput> PictureInput::open(const std::filesystem::path& path) {
     return input;
 }
 
+PictureInput PictureInput::ofJpeg(QByteArray file) {
+    PictureInput input;
+    input.m_size = file.size();
+    input.m_bytes = std::move(file);
+    return input;
+}
+
 PictureInput::PictureInput(PictureInput&& other) noexcept
     : m_path(std::move(other.m_path))
     , m_file(std::exchange(other.m_file, -1))
+    , m_bytes(std::move(other.m_bytes))
+    , m_at(other.m_at)
     , m_size(other.m_size)
     , m_format(other.m_format) {}
 
@@ -79,7 +89,13 @@ PictureInput::~PictureInput() {
         ::close(m_file);
 }
 
-std::ptrdiff_t PictureInput::read(void* target, std::size_t count) const {
+std::ptrdiff_t PictureInput::read(void* target, std::size_t count) {
+    if (m_file < 0) {
+        const auto part = std::min(static_cast<std::int64_t>(count), m_size - m_at);
+        std::memcpy(target, m_bytes.constData() + m_at, static_cast<std::size_t>(part));
+        m_at += part;
+        return part;
+    }
     ssize_t got = 0;
     do {
         got = ::read(m_file, target, count);

@@ -132,6 +132,26 @@ int colourWhole(const std::uint8_t* y, const std::uint8_t* cb, const std::uint8_
 #endif
 }
 
+// Handles the whole vectors of the row; returns the number of samples done.
+int addWhole(const std::uint8_t* const* rows, std::size_t count, std::uint16_t* sums, int width) {
+#if HWY_TARGET == HWY_SCALAR
+    static_cast<void>(rows), static_cast<void>(count), static_cast<void>(sums), static_cast<void>(width);
+    return 0;
+#else
+    const HWY_CAPPED(std::uint16_t, 16) d16;
+    const hn::Rebind<std::uint8_t, decltype(d16)> d8;
+    const int lanes = static_cast<int>(hn::Lanes(d16));
+    int x = 0;
+    for (; x + lanes <= width; x += lanes) {
+        auto sum = hn::Zero(d16);
+        for (std::size_t i = 0; i < count; ++i)
+            sum = hn::Add(sum, hn::PromoteTo(d16, hn::LoadU(d8, rows[i] + x)));
+        hn::StoreU(sum, d16, sums + x);
+    }
+    return x;
+#endif
+}
+
 // weights: for each of 256 phases the four weights, 14 fraction bits, as [w0 w1 w0 w1 w0 w1 w0 w1] [w2 w3 w2 w3 w2 w3
 // w2 w3].
 #if HWY_TARGET == HWY_SCALAR
@@ -229,6 +249,7 @@ HWY_EXPORT(sample);
 HWY_EXPORT(splitWhole);
 HWY_EXPORT(joinWhole);
 HWY_EXPORT(colourWhole);
+HWY_EXPORT(addWhole);
 
 constexpr int phases = 256;
 
@@ -291,6 +312,15 @@ void joinRow(std::span<std::uint8_t* const> planes, int width, std::uint32_t* to
 int lumaAndChromaToPixels(const std::uint8_t* y, const std::uint8_t* cb, const std::uint8_t* cr, int width,
                           std::uint32_t* to, const std::array<std::int32_t, 4>& factors) {
     return HWY_DYNAMIC_DISPATCH(colourWhole)(y, cb, cr, width, to, factors.data());
+}
+
+void addRows(std::span<const std::uint8_t* const> rows, std::uint16_t* sums, int width) {
+    for (int x = HWY_DYNAMIC_DISPATCH(addWhole)(rows.data(), rows.size(), sums, width); x < width; ++x) {
+        unsigned sum = 0;
+        for (const std::uint8_t* row : rows)
+            sum += row[x];
+        sums[x] = static_cast<std::uint16_t>(sum);
+    }
 }
 
 void sampleLine(const PaddedPicture& source, SampleLine line, std::uint32_t* out, int count) {

@@ -24,6 +24,9 @@ void joinRow(std::span<std::uint8_t* const> planes, int width, std::uint32_t* to
 int lumaAndChromaToPixels(const std::uint8_t* y, const std::uint8_t* cb, const std::uint8_t* cr, int width,
                           std::uint32_t* to, const std::array<std::int32_t, 4>& factors);
 
+// sums[x] becomes the sum of the samples x of all rows; at most 257 rows.
+void addRows(std::span<const std::uint8_t* const> rows, std::uint16_t* sums, int width);
+
 // A picture with its edge pixels repeated around it, so that a 4x4 sample near the edge needs no test.
 struct PaddedPicture {
     const std::uint32_t* origin; // pixel (0, 0)

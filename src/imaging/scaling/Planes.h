@@ -12,6 +12,10 @@ struct PlaneLayout {
     double pitchY = 1;
     int rowsAtOnce = 1; // rows between two calls of rowsReady
     int rowBytes = 0;   // bytes that are written of a row
+    // Samples a side of the blocks in which the file has the plane, and what the mean of a block, less 128, is a
+    // multiple of, in eighths. 1 and 0 where the plane is made of pixels.
+    int block = 1;
+    int meanStep = 0;
 };
 
 // Receives the planes of a picture row by row from the top, so that no whole plane lies in memory.

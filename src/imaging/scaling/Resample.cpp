@@ -5,9 +5,11 @@
 #include "imaging/files/JpegWriter.h"
 #include "imaging/scaling/PixelRows.h"
 #include "imaging/scaling/PlaneScaler.h"
+#include "imaging/scaling/ShrunkPlanes.h"
 
 #include <algorithm>
 #include <optional>
+#include <utility>
 
 namespace lumora {
 
@@ -101,6 +103,11 @@ private:
     std::vector<unsigned char> m_neutral;
     int m_next = 0;
 };
+
+// The format that pixels of a picture without alpha have.
+Bitmap unfilled(PictureSize size) {
+    return Bitmap(QImage(size.width, size.height, QImage::Format_RGB32));
+}
 
 class JpegTaker : public ScalingTaker {
 public:
@@ -237,7 +244,7 @@ Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRe
         auto whole = reader.readBitmap(denominator);
         return whole ? Result<Bitmap>(resampledPart(*whole, size, part, kernels)) : whole;
     }
-    Bitmap target(QImage(part.size(), QImage::Format_RGB32));
+    Bitmap target = unfilled({part.width(), part.height()});
     if (target.isNull())
         return Failure{Failure::Kind::TooLarge, u"memory is short"_s};
     BitmapTaker taker(reader.size(), size, part, target, kernels);
@@ -247,11 +254,22 @@ Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRe
 }
 
 Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
-                                       const ResampleKernels& kernels, PictureTimes* times) {
+                                       const ResampleKernels& kernels, PictureTimes* times, SmallCopy* small) {
     Stopwatch watch(times);
     JpegWriter writer(size, quality, JpegWriter::Input::Planes);
     JpegTaker taker(reader.size(), size, writer, kernels, watch);
-    auto read = reader.readPlanes(decodeDenominator(reader.size(), size), taker);
+    const int denominator = decodeDenominator(reader.size(), size);
+    Result<void> read;
+    Bitmap pixels = small != nullptr && reader.hasPlanes() ? unfilled(small->size) : Bitmap();
+    if (pixels.isNull()) {
+        read = reader.readPlanes(denominator, taker);
+    } else {
+        BitmapTaker smallTaker(reader.size(), small->size, wholeOf(small->size), pixels, kernels);
+        ShrunkPlanes both(taker, smallTaker, decodeDenominator(reader.size(), small->size));
+        read = reader.readPlanes(denominator, both);
+        if (read && both.reachesSmall())
+            small->pixels = std::move(pixels);
+    }
     watch.add(&PictureTimes::decode);
     if (!read)
         return read.failure();

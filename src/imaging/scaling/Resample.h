@@ -32,6 +32,7 @@ Result<Bitmap> readResampled(JpegReader& reader, PictureSize size, const Resampl
 Result<Bitmap> readResampledPart(JpegReader& reader, PictureSize size, const QRect& part,
                                  const ResampleKernels& kernels = bestKernels());
 Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int quality,
-                                       const ResampleKernels& kernels = bestKernels(), PictureTimes* times = nullptr);
+                                       const ResampleKernels& kernels = bestKernels(), PictureTimes* times = nullptr,
+                                       SmallCopy* small = nullptr);
 
 } // namespace lumora
