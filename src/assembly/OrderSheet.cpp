@@ -212,20 +212,25 @@ QList<SheetLine> albumSheetLines(const SessionState& state, const QDateTime& now
     };
 }
 
+SheetPlace sheetPlaceOf(PictureSize picture) {
+    const double ratio = static_cast<double>(picture.height) / std::max(picture.width, 1);
+    const bool turned = ratio >= 1;
+    const double across = turned ? sheetCellSize / ratio : sheetCellSize * ratio;
+    const int height = std::max(1, static_cast<int>(RoundHalfEven(across)));
+    return {turned ? PictureSize{height, sheetCellSize} : PictureSize{sheetCellSize, height}, turned};
+}
+
+Bitmap laidOnSheet(const Bitmap& upright, const SheetPlace& place) {
+    return place.turned ? Bitmap(upright.image().transformed(QTransform().rotate(90))) : upright;
+}
+
 Result<Bitmap> sheetThumbnail(const std::filesystem::path& source) {
     const Result<PictureSize> size = readPictureSize(source);
     if (!size)
         return size.failure();
-    const double ratio = static_cast<double>(size->height) / std::max(size->width, 1);
-    const bool turned = ratio >= 1;
-    const double across = turned ? sheetCellSize / ratio : sheetCellSize * ratio;
-    const int height = std::max(1, static_cast<int>(RoundHalfEven(across)));
-    if (!turned)
-        return loadPictureScaled(source, {sheetCellSize, height});
-    Result<Bitmap> upright = loadPictureScaled(source, {height, sheetCellSize});
-    if (!upright)
-        return upright;
-    return Bitmap(upright->image().transformed(QTransform().rotate(90)));
+    const SheetPlace place = sheetPlaceOf(*size);
+    const Result<Bitmap> upright = loadPictureScaled(source, place.upright);
+    return upright ? Result<Bitmap>(laidOnSheet(*upright, place)) : upright;
 }
 
 PlacedLines placeSheetLines(const QList<SheetLine>& lines, int sheetWidth) {
@@ -273,14 +278,13 @@ int OrderSheet::firstRowTop() const {
     return sheetCellSize + (m_kind == SheetKind::Album ? 282 : 81) + m_added;
 }
 
-int OrderSheet::capacity() const {
-    const int lastRow = m_size.height / sheetCellSize - 1;
-    const int lastColumn = m_size.width / sheetCellSize - 2;
+int OrderSheet::capacityOf(PictureSize size) {
+    const int lastRow = size.height / sheetCellSize - 1;
+    const int lastColumn = size.width / sheetCellSize - 2;
     return lastRow * (lastColumn + 1);
 }
 
 void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after) {
-    const int columns = m_size.width / sheetCellSize - 1;
     const int count = std::min(capacity(), static_cast<int>(cells.size()));
     WorkAhead<Result<Bitmap>> thumbnails(count, [&cells](int i) -> WorkAhead<Result<Bitmap>>::Work {
         const auto source = cells[static_cast<std::size_t>(i)].source;
@@ -288,9 +292,17 @@ void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const std
             return source ? sheetThumbnail(*source) : Failure{Failure::Kind::NotFound, {}};
         };
     });
+    drawContactSheet(
+        cells, [&](const std::function<void()>& whileWaiting) { return thumbnails.take(whileWaiting); }, after);
+}
+
+void OrderSheet::drawContactSheet(const std::vector<SheetCell>& cells, const NextPicture& next,
+                                  const std::function<bool(int)>& after) {
+    const int columns = m_size.width / sheetCellSize - 1;
+    const int count = std::min(capacity(), static_cast<int>(cells.size()));
     for (int i = 0; i < count; ++i) {
         bool wanted = true;
-        const Result<Bitmap> picture = thumbnails.take([&] { wanted = wanted && after(i); });
+        const Result<Bitmap> picture = next([&] { wanted = wanted && after(i); });
         if (wanted && picture) {
             const QPoint at((sheetCellSize + 2) * (i % columns) + 5, firstRowTop() + sheetCellSize * (i / columns));
             QPainter painter(&m_bitmap.image());

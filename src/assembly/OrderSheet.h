@@ -60,8 +60,16 @@ struct SheetCell {
 
 inline constexpr int sheetCellSize = 80;
 
-// A picture as the sheet shows it, always in landscape: 80 pixels wide, a portrait or square one turned a quarter
+// How a picture lies on the sheet, always in landscape: 80 pixels wide, a portrait or square one turned a quarter
 // clockwise.
+struct SheetPlace {
+    PictureSize upright; // before it is turned
+    bool turned;
+};
+SheetPlace sheetPlaceOf(PictureSize picture);
+Bitmap laidOnSheet(const Bitmap& upright, const SheetPlace& place);
+
+// A picture as the sheet shows it.
 Result<Bitmap> sheetThumbnail(const std::filesystem::path& source);
 
 class OrderSheet {
@@ -76,8 +84,15 @@ public:
     // after each cell and while it waits; false ends the drawing.
     void drawContactSheet(const std::vector<SheetCell>& cells, const std::function<bool(int)>& after);
 
+    // The same where somebody else makes the pictures: the next one in the order of the cells. It calls its argument
+    // again and again until the picture is there.
+    using NextPicture = std::function<Result<Bitmap>(const std::function<void()>& whileWaiting)>;
+    void drawContactSheet(const std::vector<SheetCell>& cells, const NextPicture& next,
+                          const std::function<bool(int)>& after);
+
     // How many cells the grid holds.
-    int capacity() const;
+    int capacity() const { return capacityOf(m_size); }
+    static int capacityOf(PictureSize size);
 
     const Bitmap& bitmap() const { return m_bitmap; }
 

@@ -1,5 +1,6 @@
 #include "assembly/PaperResize.h"
 
+#include "assembly/OrderSheet.h"
 #include "editing/render/PlainPrint.h"
 #include "platform/files/HostPath.h"
 
@@ -7,7 +8,7 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper) {
+Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper, Bitmap* sheetPicture) {
     const Result<PictureSize> size = readPictureSize(source);
     if (!size)
         return size.failure();
@@ -17,7 +18,13 @@ Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize 
                        u"%1: nothing is left of a picture of %2 x %3 on this paper"_s.arg(toText(source))
                            .arg(size->width)
                            .arg(size->height)};
-    return scalePictureToJpeg(source, target, printQuality);
+    const SheetPlace place = sheetPlaceOf(*size);
+    SmallCopy small{place.upright};
+    Result<QByteArray> print =
+        scalePictureToJpeg(source, target, printQuality, nullptr, sheetPicture != nullptr ? &small : nullptr);
+    if (!small.pixels.isNull())
+        *sheetPicture = laidOnSheet(small.pixels, place);
+    return print;
 }
 
 } // namespace lumora

@@ -2,6 +2,7 @@
 
 #include "common/PaperSize.h"
 #include "common/Result.h"
+#include "imaging/Bitmap.h"
 
 #include <QByteArray>
 
@@ -13,6 +14,8 @@ inline constexpr int printQuality = 90; // of the JPEG
 
 // The plain print: the picture in the size of paperPictureSize(), as the bytes of a JPEG. Touches nothing but the
 // source file, so that it may run beside the thread that packs the picture before. A picture of no height is a failure.
-Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper);
+// sheetPicture becomes what sheetThumbnail() makes of the source, out of the same decode; it stays null where that
+// takes a decode of its own.
+Result<QByteArray> resizeToPaper(const std::filesystem::path& source, PaperSize paper, Bitmap* sheetPicture = nullptr);
 
 } // namespace lumora

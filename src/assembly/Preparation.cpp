@@ -187,15 +187,20 @@ void Preparation::notWritten(const Failure& failure) {
 }
 
 std::optional<Bitmap> Preparation::drawSheet(SheetKind kind, const QStringList& lines, const QList<SheetLine>& texts,
-                                             const std::vector<SheetCell>& cells) {
+                                             const std::vector<SheetCell>& cells,
+                                             const OrderSheet::NextPicture& pictures) {
     OrderSheet sheet(kind, orderSheetSize(kind, static_cast<int>(lines.size())), orderSheetBackground(kind, m_state));
     sheet.drawLines(texts);
     m_events.drawingSheet(0);
     bool goOn = true;
-    sheet.drawContactSheet(cells, [&](int i) {
+    const auto after = [&](int i) {
         m_events.drawingSheet(i + 1);
         return goOn = m_events.yield();
-    });
+    };
+    if (pictures)
+        sheet.drawContactSheet(cells, pictures, after);
+    else
+        sheet.drawContactSheet(cells, after);
     if (!goOn)
         return std::nullopt;
     m_sheetSaved = m_events.sheetDrawn(sheet.bitmap());

@@ -85,9 +85,9 @@ protected:
     void notWritten(const Failure& failure);
     // Tells of what is kept for going on with the order: it can be sent without.
     void keep(const Result<void>& written);
-    // No value when a click ended the program.
+    // pictures: of the cells, where somebody else makes them. No value when a click ended the program.
     std::optional<Bitmap> drawSheet(SheetKind kind, const QStringList& lines, const QList<SheetLine>& texts,
-                                    const std::vector<SheetCell>& cells);
+                                    const std::vector<SheetCell>& cells, const OrderSheet::NextPicture& pictures = {});
     // Writes the next order's number.
     void countOrder();
     // False when the log can't be written: an order is not sent without it.

@@ -33,7 +33,7 @@ PrintPacker::Outcome PrintPacker::pack(const Line& line, const std::function<Res
     const Result<QByteArray> made = picture();
     if (!made)
         return {};
-    if (const Result<void> written = m_files.writeWhole(m_scratch, *made); !written)
+    if (const Result<void> written = m_files.writePassing(m_scratch, *made); !written)
         return {false, written.failure(), {}};
 
     const QString base = PrintBaseName(line.path);

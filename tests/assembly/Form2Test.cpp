@@ -36,6 +36,25 @@ TEST_F(PreparingAPlainOrder, makesTheWholeFolderAndHandsItToTheSender) {
     EXPECT_TRUE(machine.dialogs.messages.isEmpty()) << machine.dialogs.messages.join(u'|').toStdString();
 }
 
+TEST_F(PreparingAPlainOrder, PrintsEachPictureAsItselfAlsoWhereTheSheetIsFull) {
+    QStringList paths, items;
+    for (int i = 0; i < 92; ++i) // 88 cells
+        paths += givePicture(u"abc%1.jpg"_s.arg(i), 40 + i, 30, QColor(2 * i, 90, 120));
+    for (const QString& path : paths)
+        items += line(path);
+    std::filesystem::remove(host(paths[3]));
+    write(DrivePath(paths[90]), "no picture");
+    openWith(items).Command6_Click();
+    ASSERT_EQ(front(), PageId::FtpFrm);
+    EXPECT_EQ(state.transfer.leftOut.size(), 2);
+    const QStringList prints = printFiles();
+    paths.remove(90);
+    paths.remove(3);
+    ASSERT_EQ(prints.size(), paths.size());
+    for (int i = 0; i < prints.size(); ++i)
+        EXPECT_EQ(take(unpacked(prints[i])).picture, take(resizeToPaper(host(paths[i]), {10, 15}))) << i;
+}
+
 TEST_F(PreparingAPlainOrder, neverPrintsADamagedPictureAsTheOneBeforeIt) {
     for (const int deep : {0, 1}) {
         state.DchisaAmoka = static_cast<std::int16_t>(deep);

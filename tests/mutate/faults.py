@@ -453,19 +453,23 @@ FAULTS = {
         F('items <= step.upTo', 'items < step.upTo', 'sheets at a step are too large'),
         F('u"LOB"', 'u"LOK"', 'the sheet does not tell where the prints are fetched', seen=True),
         F('(sheetCellSize + 2) * (i % columns) + 5', 'sheetCellSize * (i % columns) + 5', 'pictures of the sheet touch'),
-        F('m_size.width / sheetCellSize - 2', 'm_size.width / sheetCellSize - 1', 'more pictures than the sheet has room for'),
+        F('= size.width / sheetCellSize - 2', '= size.width / sheetCellSize - 1', 'more pictures than the sheet has room for'),
         F('ratio >= 1', 'ratio > 1', 'square pictures stand on the sheet'),
         F('return {255, 192, 255};', 'return {255, 255, 192};', 'mixed sizes are not marked by their colour')],
     'src/assembly/PaperResize.cpp': [
-        F('scalePictureToJpeg(source, target, printQuality)', 'scalePictureToJpeg(source, target, 70)', 'plain prints are coarser than agreed')],
+        F('target, printQuality', 'target, 70', 'plain prints are coarser than agreed')],
     'src/assembly/PrintPacker.cpp': [
         F('m_files.fileExists(print) ? m_files.removeFile(print) : Result<void>()', 'Result<void>()', 'half of a print that the log names as failed is sent'),
         F('static_cast<void>(picture());', '', 'a print that was made ahead comes out as its neighbour'),
         F('m_tail.form(m_tailForm, base)', 'm_tail.form(m_tailForm, line.code)', 'the tail names another picture')],
+    'src/assembly/plain/PlainPrints.cpp': [
+        F('m_lines.back().hasUsableName() && !HasQuestionMark(items[i])', 'm_lines.back().hasUsableName()',
+          'each print behind an odd name is that of its neighbour'),
+        F('m_wanted[i] && !m_ready[i]', 'm_wanted[i]', 'the prints that the sheet has no room for are those of others')],
+    'src/imaging/scaling/ShrunkPlanes.cpp': [
+        F('blocksAStep) + area / 2', 'blocksAStep)', 'the pictures of the sheet are darker than those on the screen')],
     'src/assembly/plain/PlainPreparation.cpp': [
         F('ending == u"JPG" || ending == u"jpg"', 'ending == u"jpg"', 'pictures of most cameras are left out'),
-        F('!there.contains(i) && picture.hasUsableName() && !HasQuestionMark(items[i])', '!there.contains(i) && picture.hasUsableName()',
-          'each print behind an odd name is that of its neighbour'),
         F('RightPart(split(line).path.stem(), 9)', 'RightPart(split(line).path.stem(), 8)', 'the sheet cuts the names',
           told='a letter of a caption; log and print carry the whole name'),
         F('encodeJpeg(*drawn, printQuality)', 'encodeJpeg(*drawn, 50)', 'the sheet is coarse')],
@@ -481,7 +485,7 @@ FAULTS = {
         F('placeAtCentreIfUnset(edit, previewBox(*m_paper, orientationOf(*size)));', '', 'a picture that was never opened prints stretched'),
         F('line.editState.trimmed().isEmpty() ? EditRecord::newPicture() : line.editState', 'line.editState',
           'a blank record has no place')],
-    'src/assembly/edited/EditedPrints.cpp': [F('edit.ToneFlag != 1', 'true', 'grey pictures print in colour')],
+    'src/assembly/edited/EditedPrints.cpp': [F('edit.ToneFlag == 1', 'false', 'no copy is kept of a grey picture')],
 
     'src/transfer/ftp/FtpArrival.cpp': [
         F('!found || entry.length > found->length', 'true', 'of two lengths the last is believed',

@@ -18,12 +18,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-constexpr int previewWidth = 300;
-
-} // namespace
-
 EditedPreparation::EditedPreparation(SessionState& state, const Platform& platform, PreparationEvents& events)
     : Preparation(state, platform, events)
     , m_jobFolder(WorkspacePaths::jobFolder(state)) {}
@@ -68,18 +62,18 @@ void EditedPreparation::preparePicture(int index, PrintPacker& packer, EditedPri
         return;
     m_events.inWork(line.path);
     if (isThere(index)) {
-        remakeThumbnail(index, line, packer.scratch());
-        packer.removeScratch();
+        remakeThumbnail(index, line);
         return;
     }
     if (isGivenUp(index, line.path))
         return;
-    if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints); }))
-        saveThumbnail(line, packer.scratch());
+    Bitmap preview;
+    if (pack(packer, {index, line.code, line.path}, [&] { return renderPicture(line, prints, preview); }))
+        saveThumbnail(line, preview);
     packer.removeScratch();
 }
 
-Result<QByteArray> EditedPreparation::renderPicture(const BasketLine& line, EditedPrints& prints) {
+Result<QByteArray> EditedPreparation::renderPicture(const BasketLine& line, EditedPrints& prints, Bitmap& preview) {
     EditedPrintResult made = prints.next([this] { m_platform.pump.pump(); });
     if (made.toneCopy) {
         if (const Result<void> kept = keepToneCopy(line, *made.toneCopy); !kept) {
@@ -87,6 +81,7 @@ Result<QByteArray> EditedPreparation::renderPicture(const BasketLine& line, Edit
             return kept.failure();
         }
     }
+    preview = made.preview;
     return made.jpeg;
 }
 
@@ -103,7 +98,7 @@ Result<void> EditedPreparation::keepToneCopy(const BasketLine& line, NewContent&
 }
 
 // A kill may have come between print and thumbnail.
-void EditedPreparation::remakeThumbnail(int index, const BasketLine& line, const DrivePath& scratch) {
+void EditedPreparation::remakeThumbnail(int index, const BasketLine& line) {
     if (m_platform.files.fileExists(thumbnailPath(line)))
         return;
     const DrivePath path = m_folder->filePath(PrintNameOf(line, index, OrderKind::EditedPrint));
@@ -113,10 +108,7 @@ void EditedPreparation::remakeThumbnail(int index, const BasketLine& line, const
     const Result<PrintFileContent> print = readPrintFile(*bytes, PrintFileShape::of(m_state.profile));
     if (!print)
         return keep(Failure{print.failure().kind, u"%1: %2"_s.arg(path.text(), print.failure().message)});
-    const Result<void> written = m_platform.files.writePassing(scratch, print->picture);
-    keep(written);
-    if (written)
-        saveThumbnail(line, scratch);
+    saveThumbnail(line, printPreview(print->picture));
 }
 
 DrivePath EditedPreparation::thumbnailPath(const BasketLine& line) const {
@@ -124,21 +116,14 @@ DrivePath EditedPreparation::thumbnailPath(const BasketLine& line) const {
 }
 
 // Two pictures of one name and one number of copies share a thumbnail, and the sheet then shows the later one.
-void EditedPreparation::saveThumbnail(const BasketLine& line, const DrivePath& scratch) {
-    const std::optional<HostPath> source = m_platform.files.drives().toHost(scratch);
+void EditedPreparation::saveThumbnail(const BasketLine& line, const Bitmap& preview) {
     const DrivePath path = thumbnailPath(line);
     const std::optional<HostPath> target = m_platform.files.drives().toHost(path);
-    const Result<PictureSize> size =
-        source ? readPictureSize(*source) : Failure{Failure::Kind::NotFound, scratch.text()};
-    if (!size || !target)
+    if (preview.isNull() || !target)
         return;
-    const auto height = static_cast<int>(RoundHalfEven(static_cast<double>(previewWidth) * size->height / size->width));
-    const Result<Bitmap> preview = loadPictureScaled(*source, {previewWidth, std::max(1, height)});
-    if (!preview)
-        return;
-    m_events.printed(*preview);
+    m_events.printed(preview);
     NewContent thumbnail(*target, path.text());
-    appendBmp(*preview, thumbnail, [] { return false; });
+    appendBmp(preview, thumbnail, [] { return false; });
     const Result<void> saved = thumbnail.commit(NewContent::Durability::Passing);
     keep(saved ? kept().keepThumbnail(path) : saved);
 }

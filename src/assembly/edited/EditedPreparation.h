@@ -19,12 +19,12 @@ public:
 
 private:
     void preparePicture(int index, PrintPacker& packer, EditedPrints& prints);
-    Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints);
+    Result<QByteArray> renderPicture(const BasketLine& line, EditedPrints& prints, Bitmap& preview);
     Result<void> keepToneCopy(const BasketLine& line, NewContent& copy);
     KeptWork kept() const;
     DrivePath thumbnailPath(const BasketLine& line) const;
-    void remakeThumbnail(int index, const BasketLine& line, const DrivePath& scratch);
-    void saveThumbnail(const BasketLine& line, const DrivePath& scratch);
+    void remakeThumbnail(int index, const BasketLine& line);
+    void saveThumbnail(const BasketLine& line, const Bitmap& preview);
     std::optional<Bitmap> drawSheet();
 
     const DrivePath m_jobFolder;

@@ -4,6 +4,7 @@
 
 namespace lumora {
 
+class PlainPrints;
 class TextList;
 
 // Prepares a plain order: each picture is scaled to the paper, or copied as it is where deep compression is on.
@@ -24,10 +25,10 @@ public:
     bool prepare(const QStringList& lines);
 
 private:
-    class Prints;
-
-    bool makeSheet(); // false when a click ended the program, and where the order is held back
-    void packPicture(int index, PrintPacker& packer, Prints& prints);
+    std::vector<SheetCell> cellsOf(const QStringList& lines) const;
+    QList<SheetLine> textsOf(SheetKind kind) const;
+    bool makeSheet(PlainPrints& prints); // false when a click ended the program, and where the order is held back
+    void packPicture(int index, PrintPacker& packer, PlainPrints& prints);
 };
 
 } // namespace lumora

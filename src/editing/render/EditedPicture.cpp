@@ -276,6 +276,17 @@ Result<Bitmap> loadGrey(const fs::path& file) {
     return picture;
 }
 
+std::int64_t renderingMemory(const EditedPrint& print, const EditFields& edit) {
+    const std::int64_t decode = decodingMemory(print.file, edit.ToneFlag == 1 ? Decode::Whole : Decode::Rows);
+    const auto size = readPictureSize(print.file);
+    if (!size)
+        return decode;
+    const auto bitmap = [](PictureSize pixels) { return std::int64_t{4} * pixels.width * pixels.height; };
+    const PrintGeometry geometry = printGeometry(print.paper, orientationOf(*size));
+    // The reduced picture, the paper, and the frame that lies over it.
+    return decode + bitmap(reducedSize(*size, printPlacement(*size, geometry, edit))) + 2 * bitmap(geometry.size);
+}
+
 Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times) {
     Stopwatch watch(times);
     const auto size = readPictureSize(print.file);

@@ -99,6 +99,9 @@ struct EditedPrint {
 // The whole picture as a tone prints it: grey at full size, ahead of any scaling.
 Result<Bitmap> loadGrey(const std::filesystem::path& file);
 
+// About how many bytes of memory the print takes while it is made.
+std::int64_t renderingMemory(const EditedPrint& print, const EditFields& edit);
+
 // The pixels of the print: 100 a centimetre, lying or upright as the file is.
 Result<Bitmap> renderEditedPrint(const EditedPrint& print, const EditFields& edit, PictureTimes* times = nullptr);
 
