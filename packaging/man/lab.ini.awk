@@ -34,4 +34,4 @@ FNR == 1 {
   next
 }
 /^$/ && words != "" { printf "%s", words; words = "" }
-END { print ".SH SEE ALSO\nlumora(1)" }
+END { print ".SH SEE ALSO\nlumora(1), lumora\\-kiosk(8); /usr/share/lumora/lab.ini.example is this file to begin with." }

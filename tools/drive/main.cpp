@@ -1,4 +1,5 @@
 #include "app/Program.h"
+#include "common/NoScreen.h"
 #include "drive/RandomWalk.h"
 #include "drive/ScenarioPlayer.h"
 #include "views/window/Application.h"
@@ -54,7 +55,7 @@ int walk(RandomWalk& walk, const ProgramOptions& options) {
 }
 
 int play(int argc, char** argv) {
-    qputenv("QT_QPA_PLATFORM", "offscreen");
+    goWithoutScreen();
     Application application(argc, argv);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
 
@@ -63,7 +64,7 @@ int play(int argc, char** argv) {
         u"Runs the pages of lumora without a screen and does at them what scenario files say, a command "
         u"a line:\n\n"_s +
         scenarioHelp() +
-        u"\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n"
+        u"\nA line that begins with # is a comment. \\n in a text is a line break, \\\\ a backslash.\n\n"
         u"Exit status: 0 all held, 1 a line failed, 2 nothing could be played, 3 another program "
         u"has the data folder."_s);
     parser.addHelpOption();

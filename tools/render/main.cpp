@@ -2,6 +2,7 @@
 
 #include "assembly/PaperResize.h"
 #include "common/HostFile.h"
+#include "common/NoScreen.h"
 #include "editing/render/EditedPicture.h"
 #include "editing/render/PlainPrint.h"
 #include "imaging/PictureMemory.h"
@@ -35,21 +36,21 @@ constexpr std::string_view help =
     R"(Usage: lumora-render MODE [options] FILE...
 
 Modes:
-  plain   the picture scaled to the paper as an order without edits prints it (needs --paper)
-  small   the small picture of a cell, as PNG
-  preview what the editor shows of an edited picture, as PNG (needs --paper)
-  print   the print of an edited picture (needs --paper)
+  plain    the picture scaled to the paper as an order without edits prints it (needs --paper)
+  small    the small picture of a cell, as PNG
+  preview  what the editor shows of an edited picture, as PNG (needs --paper)
+  print    the print of an edited picture (needs --paper)
 
 Options:
-  --paper 10/15   the paper, short side and long side in centimetres
-  --record TEXT   the edit record for preview and print; blanks follow (default: a picture that was not edited);
-                  with red eyes corrected, FILE is the corrected copy
-  --frames FOLDER the folder that holds the categories of frames (default: no frames)
+  --paper 10/15    the paper, short side and long side in centimetres
+  --record TEXT    the edit record for preview and print; blanks follow (default: a picture that was not edited);
+                   with red eyes corrected, FILE is the corrected copy
+  --frames FOLDER  the folder that holds the categories of frames (default: no frames)
   --background RRGGBB  what an uncovered part of the paper shows (default: the whole picture, stretched)
-  --size 115      pixels of the cell for the mode small (default 115)
-  --png           the pixels before JPEG, as PNG
-  --out FOLDER    where results go (default: the current folder); they keep the base name
-  --time          prints a line a file: milliseconds of decode, draw and encode
+  --size 115       pixels of the cell for the mode small (default 115)
+  --png            the pixels before JPEG, as PNG
+  --out FOLDER     where results go (default: the current folder); they keep the base name
+  --time           prints a line a file: milliseconds of decode, draw and encode
   --help, --version
 
 Exit status: 0 all pictures done, 1 a picture failed (the others are done all the same), 2 the call can't be understood.
@@ -278,7 +279,7 @@ int main(int argc, char** argv) {
     // The application object, which loads fonts, starts slowly and is made only if text is drawn.
     std::optional<QGuiApplication> application;
     if (request->isEdited() && request->edit.TextOn == 1) {
-        qputenv("QT_QPA_PLATFORM", "offscreen");
+        goWithoutScreen();
         application.emplace(argc, argv);
     }
     std::vector<fs::path> targets;

@@ -1,6 +1,7 @@
 #include "app/CodePrompt.h"
 #include "app/Program.h"
 #include "app/StationCommands.h"
+#include "common/NoScreen.h"
 #include "imaging/PictureMemory.h"
 #include "session/lab/LabFile.h"
 #include "station/ServiceNotice.h"
@@ -66,11 +67,13 @@ int main(int argc, char** argv) {
         return QByteArrayList{"-h", "--help", "-v", "--version", "--check", "--support", "--keys"}.contains(
             QByteArray(word).split('=').first());
     };
-    if (std::any_of(argv + 1, argv + argc, showsNoPage))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    const QtMessageHandler usual = qInstallMessageHandler(tellNoScreen);
+    const bool pages = std::none_of(argv + 1, argv + argc, showsNoPage);
+    const QtMessageHandler usual = pages ? qInstallMessageHandler(tellNoScreen) : nullptr;
+    if (!pages)
+        goWithoutScreen();
     Application application(argc, argv);
-    qInstallMessageHandler(usual);
+    if (pages)
+        qInstallMessageHandler(usual);
     Application::setApplicationVersion(QStringLiteral(LUMORA_VERSION));
     QCommandLineParser parser;
     parser.setApplicationDescription(u"Orders prints from a photo lab."_s);
