@@ -44,6 +44,16 @@ QueuePrinter::~QueuePrinter() {
     }
 }
 
+Result<QStringList> QueuePrinter::queues(std::chrono::milliseconds limit) {
+    QProcess child;
+    child.start(u"lpstat"_s, {u"-e"_s});
+    const bool ended = child.waitForFinished(static_cast<int>(limit.count()));
+    const Result<void> outcome = queueOutcome(child, !ended && child.error() == QProcess::Timedout);
+    if (!outcome)
+        return outcome.failure();
+    return QString::fromLocal8Bit(child.readAllStandardOutput()).split(u'\n', Qt::SkipEmptyParts);
+}
+
 void QueuePrinter::print(const QString& queue, const QByteArray& pdf, Done done) {
     auto* child = new QProcess(this);
     auto* limit = new QTimer(child);

@@ -16,6 +16,9 @@ public:
     // Without a word to those that wait for an answer.
     ~QueuePrinter() override;
 
+    // The queues that the system knows, by its program lpstat; waits for it.
+    static Result<QStringList> queues(std::chrono::milliseconds limit = std::chrono::seconds(20));
+
     void print(const QString& queue, const QByteArray& pdf, Done done) override;
 
 private:

@@ -3,6 +3,7 @@
 #include "common/HostFile.h"
 #include "editing/render/FrameLists.h"
 #include "imaging/drawing/Drawing.h"
+#include "platform/QueuePrinter.h"
 #include "platform/line/HostReach.h"
 #include "platform/line/SmtpMail.h"
 #include "session/Workspace.h"
@@ -13,8 +14,10 @@
 #include <QTemporaryDir>
 
 #include <sys/timex.h>
+#include <unistd.h>
 
 #include <algorithm>
+#include <cerrno>
 
 namespace lumora {
 
@@ -103,6 +106,7 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
     checkFrames();
     checkFonts();
     checkDoor();
+    checkPrinter();
     checkClock();
     if (!m_lab.errors.isEmpty()) {
         tell(Look, u"server"_s, u"not tried, since the lab's file can't be used"_s);
@@ -126,8 +130,13 @@ void StationCheck::checkLabFile(const HostPath& labFile) {
              u"\"lumora --help\" names where it may lie; /usr/share/lumora/lab.ini.example is an example"_s);
         return;
     }
+    const bool locked = ::access(labFile.c_str(), R_OK) != 0 && errno == EACCES;
     for (const QString& error : m_lab.errors)
-        tell(Fault, u"lab.ini"_s, error, u"the program does not start before this line is right"_s);
+        tell(Fault, u"lab.ini"_s, error,
+             !locked ? u"the program does not start before this line is right"_s
+                     : u"try it as the user to whom the file belongs (sudo -u NAME lumora --check); if that is not the "
+                       u"one who "
+                       "runs the program: chown"_s);
     for (const QString& warning : m_lab.warnings)
         tell(Fault, u"lab.ini"_s, warning);
     if (m_lab.errors.isEmpty() && m_lab.warnings.isEmpty())
@@ -194,6 +203,25 @@ void StationCheck::checkDoor() {
     else
         tell(Fault, u"formats"_s, u"%1 is missing: pictures of phones can't be ordered"_s.arg(toText(m_doorProgram)),
              u"install the program anew, or set [Door] Formats = jpg"_s);
+}
+
+void StationCheck::checkPrinter() {
+    const QString& wanted = m_lab.deployment.kiosk.printer;
+    if (wanted.isEmpty())
+        return;
+    const QString subject = u"slips"_s;
+    const Result<QStringList> queues = QueuePrinter::queues();
+    if (!queues)
+        tell(Look, subject, queues.failure().message,
+             queues.failure().kind == Failure::Kind::NoProgram
+                 ? u"install the package cups-client"_s
+                 : u"no slip is printed: is the print service on? systemctl status cups"_s);
+    else if (!queues->contains(wanted))
+        tell(Look, subject, u"there is no print queue %1, and no slip is printed"_s.arg(wanted),
+             queues->isEmpty() ? u"set the printer up; the system knows no queue"_s
+                               : u"set [Kiosk] Printer to one of these: %1"_s.arg(queues->join(u", "_s)));
+    else
+        tell(Good, subject, u"the print queue %1 is there"_s.arg(wanted));
 }
 
 void StationCheck::checkClock() {

@@ -44,6 +44,7 @@ private:
     void checkFrames();
     void checkFonts();
     void checkDoor();
+    void checkPrinter();
     void checkClock();
     void checkHosts();
     void checkPlainText();

@@ -190,10 +190,17 @@ TEST_F(StationCheckTest, WhatLosesOrdersIsAFault) {
         {"a wrong key", [](FakeLab&, QByteArray& file) { file += "Hots = a\n"; }, "FAULT lab.ini: "},
         {"not careful", [](FakeLab&, QByteArray& file) { file.replace("Careful = yes", "Careful = no"); },
          "look guards: "},
+        {"an unknown queue", [](FakeLab&, QByteArray& file) { file += "[Kiosk]\nPrinter = slip\n"; },
+         "look slips: there is no print queue slip,"},
         {"nothing encrypted", [](FakeLab&, QByteArray&) {},
          "look encryption: in plain text go user, password and orders"},
     };
     const QByteArray good = lab;
+    const HostPath lpstat = here / "lpstat";
+    ASSERT_TRUE(writeWholeFile(lpstat, "#!/bin/sh\ntest \"$*\" = -e && echo slips\n"));
+    fs::permissions(lpstat, fs::perms::owner_all);
+    const QByteArray path = qgetenv("PATH");
+    qputenv("PATH", QByteArray::fromStdString(here.string()) + ':' + path);
     for (const auto& one : cases) {
         SCOPED_TRACE(one.name);
         FakeLab server;
@@ -206,6 +213,7 @@ TEST_F(StationCheckTest, WhatLosesOrdersIsAFault) {
             << told.join(u'\n').toStdString();
         EXPECT_EQ(isGood, !QByteArray(one.told).startsWith("FAULT"));
     }
+    qputenv("PATH", path);
 }
 
 } // namespace

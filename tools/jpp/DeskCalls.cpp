@@ -168,6 +168,7 @@ int DeskCalls::report(const QString& folder) const {
         return tell(faultFound, report.failure().message);
     const QString base = QDir(m_parser.value(u"into"_s).isEmpty() ? u"."_s : m_parser.value(u"into"_s))
                              .filePath(u"report-%1-%2"_s.arg(from.toString(Qt::ISODate), to.toString(Qt::ISODate)));
+    QDir().mkpath(QFileInfo(base).path()); // one that can't be made is told by the file in it
     for (const auto& [ending, bytes] : {std::pair(u".csv"_s, report->csv()), {u".html"_s, report->html()}}) {
         if (const auto written = writeWholeFile(toHostPath(base + ending), bytes); !written)
             return tell(faultFound, written.failure().message);
