@@ -105,7 +105,7 @@ TEST(PicturePicker, OpensACardAtItsNewestFolderAndShowsItsDays) {
     ASSERT_TRUE(QTest::qWaitFor([&] { return !cards.all().empty() && cards.all()[0].summary; }, 20000));
     EXPECT_EQ(cards.all()[0].summary->pictures, 5) << "of every format";
     EXPECT_EQ(machine.drives.toDrive(media / "EOS"), u"D:\\"_path) << "known before its count";
-    const Theme theme(1);
+    const Theme theme(Theme::Fit{});
     QWidget window;
     Platform platform = machine.with(cards);
     platform.doorProgram = media / "hangs";

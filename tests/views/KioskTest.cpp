@@ -30,7 +30,7 @@ struct KioskWindow : ::testing::Test, PageRig {
         QTest::qWait(30);
     }
 
-    Theme theme{1};
+    Theme theme{Theme::Fit{}};
     MainWindow window{chain, state};
     ScreenDialogs dialogs{window, state, platform};
     Platform platform = machine.with(dialogs);

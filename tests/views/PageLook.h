@@ -21,8 +21,8 @@ inline void PrintTo(const Screen& screen, std::ostream* out) {
 }
 
 // Each page in each state, in both languages, on a small, a wide and a tall screen: looked at for what a person could
-// stumble over, and photographed where LUMORA_SHOTS asks for it. LUMORA_SCREENS=all brings the smallest and the largest
-// screen, and each in both languages; one of contrast stands among them.
+// stumble over, and photographed where LUMORA_SHOTS asks for it. LUMORA_SCREENS=all brings the smallest ones and the
+// largest screen, and each in both languages; one of contrast stands among them.
 class PageLook : public ::testing::TestWithParam<Screen> {
 public:
     static auto screens() {
@@ -33,7 +33,7 @@ public:
                                    {{1024, 768}, false, true}};
         if (qEnvironmentVariable("LUMORA_SCREENS") == u"all") {
             all.insert(all.end(), {{{1920, 1080}, true}, {{1080, 1920}, false}, {{1024, 768}, true, true}});
-            for (const QSize& size : {QSize(800, 600), QSize(3840, 2160)})
+            for (const QSize& size : {QSize(640, 512), QSize(800, 600), QSize(3840, 2160)})
                 all.insert(all.end(), {{size, false}, {size, true}});
         }
         return ::testing::ValuesIn(all);

@@ -53,7 +53,7 @@ TEST(Panel, LeavesThePageBelowInSightAndUsableWhereItIsNotCovered) {
 }
 
 TEST(LargePicture, ShadesWhatThePaperDoesNotTake) {
-    const Theme theme(1);
+    const Theme theme(Theme::Fit{});
     LargePicture large(theme, nullptr);
     large.resize(400, 400);
     kyoskNewControls page;

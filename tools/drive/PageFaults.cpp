@@ -24,6 +24,7 @@
 #include <QScrollArea>
 
 #include <algorithm>
+#include <climits>
 
 namespace lumora {
 
@@ -134,7 +135,7 @@ QString rowsOf(const QAbstractItemModel& model) {
 
 // Of those that can be chosen.
 int leastRow(const QWidget& widget) {
-    int least = 44;
+    int least = INT_MAX;
     if (const auto* box = qobject_cast<const QComboBox*>(&widget); box && box->count() > 0) {
         box->view()->ensurePolished();
         least = box->view()->sizeHintForRow(0);
@@ -211,6 +212,7 @@ QStringList pageFaults(Program& program, const QString& data) {
     const bool english = program.state().english();
     QStringList result;
     MainWindow& window = program.window();
+    const int least = window.width() >= 800 && window.height() >= 600 ? 44 : 36; // a finger's width
     unnamed(QAccessible::queryAccessibleInterface(&window), result);
     QAccessibleInterface* const spoken = QAccessible::queryAccessibleInterface(&window);
     rolesOf(spoken, result);
@@ -264,10 +266,11 @@ QStringList pageFaults(Program& program, const QString& data) {
             qobject_cast<const QComboBox*>(widget);
         const bool partOfBox = widget->parentWidget() && widget->parentWidget()->inherits("QComboBox");
         const bool foreign = insideScroller(*widget) || partOfBox;
-        if (control && !partOfBox && (widget->width() < 44 || widget->height() < 44))
-            result += u"%1 is %2x%3, under 44"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height());
-        if (const int row = leastRow(*widget); row < 44)
-            result += u"%1 has rows of %2, under 44"_s.arg(nameOf(*widget)).arg(row);
+        if (control && !partOfBox && (widget->width() < least || widget->height() < least))
+            result +=
+                u"%1 is %2x%3, under %4"_s.arg(nameOf(*widget)).arg(widget->width()).arg(widget->height()).arg(least);
+        if (const int row = leastRow(*widget); row < least)
+            result += u"%1 has rows of %2, under %3"_s.arg(nameOf(*widget)).arg(row).arg(least);
         if (control && !foreign) {
             if (widget->objectName().isEmpty())
                 result += u"no object name: "_s + nameOf(*widget);

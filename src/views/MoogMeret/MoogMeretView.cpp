@@ -13,8 +13,8 @@ using namespace Qt::StringLiterals;
 MoogMeretView::MoogMeretView(MoogMeret& page, const SessionState& state, const Theme& theme)
     : ViewOf(page, state, theme) {
     frame().steps().setStep(OrderStep::Sending);
-    frame().content()->addLayout(
-        inRow(Space::Wide, {{makeOrders(), 4}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}, makeWays()}), 1);
+    QLayout* parts = inRow(Space::Wide, {{makeOrders(), 4}, {makeHint(), 8}, {makeFiles(), 5}, {makeWalk(), 9}});
+    frame().content()->addLayout(across(Space::Wide, {{parts, 1}, makeWays()}), 1);
     makeBars();
     start();
 }
@@ -114,15 +114,20 @@ QWidget* MoogMeretView::makeWays() {
     follow(m_preview, c.Picture2);
     m_end = new Gauge(theme(), this);
     follow(m_end, c.endPanel);
-    QWidget* ways =
-        inBox(inColumn(Space::Normal, {m_preview,
-                                       Item::room(),
-                                       {m_end, 0, Qt::AlignCenter},
-                                       Item::room(),
-                                       label(c.Label4Shalav3, "strong"),
-                                       button(c.Command4, Role::Main, &MoogMeret::Command4_Click, u"send"_s),
-                                       button(c.Command2, Role::Secondary, &MoogMeret::Command2_Click, u"mail"_s),
-                                       label(c.Label4EinDoar, "smallMuted")}));
+    QLayout* answers =
+        inColumn(Space::Normal, {Item::room(),
+                                 {m_end, 0, Qt::AlignCenter},
+                                 Item::room(),
+                                 label(c.Label4Shalav3, "strong"),
+                                 button(c.Command4, Role::Main, &MoogMeret::Command4_Click, u"send"_s),
+                                 button(c.Command2, Role::Secondary, &MoogMeret::Command2_Click, u"mail"_s),
+                                 label(c.Label4EinDoar, "smallMuted")});
+    if (theme().isTall()) {
+        QWidget* ways = inBox(inRow(Space::Wide, {m_preview, {answers, 1}}));
+        follow(ways, c.waysPanel);
+        return ways;
+    }
+    QWidget* ways = inBox(inColumn(Space::Normal, {m_preview, {answers, 1}}));
     ways->setFixedWidth(m_preview->width());
     follow(ways, c.waysPanel);
     return ways;

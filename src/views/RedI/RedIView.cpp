@@ -40,7 +40,9 @@ RedIView::RedIView(RedI& page, const SessionState& state, const Theme& theme)
     bind(u"Picture1"_s, m_canvas, [this] { return c.caption; });
     QWidget* side = makeSide();
     frame().content()->addLayout(
-        inRow(Space::Wide, {side, {inColumn(Space::Small, {{m_canvas, 1}, makeOperator(), makeTools()}), 1}}), 1);
+        across(Space::Wide, {side, {inColumn(Space::Small, {{m_canvas, 1}, makeOperator(), makeTools()}), 1}},
+               Upright::LastOnTop),
+        1);
     makeBars();
     makeOverPicture();
     makeMenu();
@@ -68,7 +70,10 @@ QWidget* RedIView::makeSide() {
     m_guide = instruction(c.Label40);
     notice.column->addWidget(instruction(c.Label45));
     add(*card.column, {m_guide, instruction(c.Label41), instruction(c.Label44), m_notice, Item::room()});
-    QWidget* side = inBox(inColumn(Space::Small, {{m_overview, 0, Qt::AlignHCenter}, {card.frame, 1}, makePad()}));
+    QWidget* pad = makePad();
+    if (theme().isTall())
+        return inBox(inRow(Space::Normal, {{m_overview, 0, Qt::AlignVCenter}, {card.frame, 1}, pad}));
+    QWidget* side = inBox(inColumn(Space::Small, {{m_overview, 0, Qt::AlignHCenter}, {card.frame, 1}, pad}));
     side->setFixedWidth(theme().px(276));
     return side;
 }

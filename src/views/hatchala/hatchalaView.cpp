@@ -19,8 +19,8 @@ hatchalaView::hatchalaView(hatchala& page, const SessionState& state, const Them
     frame().steps().setStep(OrderStep::Start);
     frame().setTitleVisible(false);
     makeHeader();
-    // Words at the beginning of the reading direction, the picture beside them.
-    frame().content()->addLayout(inRow(Space::Far, {{makeWords(), 5}, {makeSide(), 5}}), 1);
+    // Words at the beginning of the reading direction, the picture beside them; on an upright page above them.
+    frame().content()->addLayout(across(Space::Far, {{makeWords(), 5}, {makeSide(), 5}}, Upright::LastOnTop), 1);
     makeStart();
     m_arrow = new ArrowStrip(theme, m_start, this);
     frame().content()->setSpacing(theme.size(Space::Tight));
@@ -56,10 +56,12 @@ QLayout* hatchalaView::makeWords() {
     m_noticeBox = notice.frame;
     notice.column->addWidget(label(c.Notice, "strong"));
     m_headline = label(c.Title, "display");
-    QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline, label(c.Label4How, "muted")});
+    QVBoxLayout* column = inColumn(Space::Normal, {m_noticeBox, Item::room(), m_headline,
+                                                   label(c.Label4How, theme().isTall() ? "large" : "muted")});
     const QString icons[] = {u"pictures"_s, u"printer"_s, u"send"_s};
     for (std::size_t i = 0; i < c.Label4Step.size(); ++i)
-        column->addLayout(inRow(Space::Normal, {sign(icons[i], IconSize::Line), {label(c.Label4Step[i]), 1}}));
+        column->addLayout(inRow(Space::Normal, {sign(icons[i], theme().isTall() ? IconSize::Box : IconSize::Line),
+                                                {label(c.Label4Step[i], theme().isTall() ? "large" : "body"), 1}}));
     QPushButton* prices = button(c.Image11, Role::Plain, &hatchala::Image11_Click, u"tag"_s);
     QPushButton* site = button(c.Image5, Role::Plain, &hatchala::Image5_Click, u"globe"_s);
     helpFor(prices, hatchala::Hover::Image11);

@@ -34,7 +34,7 @@ void makeTall(QPushButton& key) {
 QPushButton* toKey(QPushButton* made, const Theme& theme) {
     setRole(made, made->property("role") == u"quiet"_s ? "wordKey" : "key");
     made->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-    made->setFixedHeight(std::max(44, theme.px(50)));
+    made->setFixedHeight(std::max(theme.least(), theme.px(50)));
     return made;
 }
 
@@ -52,7 +52,7 @@ QWidget* inKeyRows(const Maker& maker, const Theme& theme, const KeyRows& keys) 
     }
     for (int i = 0; i < KeyRows::columns; ++i)
         grid->setColumnStretch(i, 10);
-    grid->setColumnStretch(KeyRows::columns, 14);
+    grid->setColumnStretch(KeyRows::columns, 16);
     grid->setColumnMinimumWidth(KeyRows::width, theme.size(Space::Small));
     addDigits(*grid, keys, KeyRows::width + 1);
     return maker.leftToRight(grid);

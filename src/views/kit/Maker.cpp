@@ -173,6 +173,14 @@ QVBoxLayout* Maker::inColumn(Space gap, std::initializer_list<Item> items) const
     return column;
 }
 
+QBoxLayout* Maker::across(Space gap, std::initializer_list<Item> items, Upright order) const {
+    QBoxLayout* line = m_theme.isTall() ? static_cast<QBoxLayout*>(inColumn(gap)) : inRow(gap);
+    add(*line, items);
+    if (m_theme.isTall() && order == Upright::LastOnTop)
+        line->setDirection(QBoxLayout::BottomToTop);
+    return line;
+}
+
 QGridLayout* Maker::inGrid(Space gap) const {
     auto* grid = new QGridLayout;
     grid->setSpacing(m_theme.size(gap));
@@ -193,7 +201,7 @@ QWidget* Maker::leftToRight(QLayout* inside) const {
 }
 
 QWidget* Maker::inMiddle(QWidget* inside, int share) const {
-    return inBox(inRow(Space::None, {Item::room(), {inside, share}, Item::room()}));
+    return inBox(inRow(Space::None, {Item::room(), {inside, m_theme.isTall() ? 3 * share : share}, Item::room()}));
 }
 
 Card Maker::makeCard(const char* role, Pad pad, Space gap) const {

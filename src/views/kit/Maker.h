@@ -39,6 +39,9 @@ struct Card {
     QVBoxLayout* column;
 };
 
+// Of parts that an upright window has one below the other.
+enum class Upright { FirstOnTop, LastOnTop };
+
 // Makes the plain parts of a page in the look of the theme. They belong to one parent until a layout takes them.
 class Maker {
 public:
@@ -48,12 +51,15 @@ public:
 
     QHBoxLayout* inRow(Space gap, std::initializer_list<Item> items = {}) const;
     QVBoxLayout* inColumn(Space gap, std::initializer_list<Item> items = {}) const;
+    // Side by side, and one below the other on an upright window.
+    QBoxLayout* across(Space gap, std::initializer_list<Item> items, Upright order = Upright::FirstOnTop) const;
     QGridLayout* inGrid(Space gap) const;
     // A widget that holds the layout and nothing around it.
     QWidget* inBox(QLayout* inside) const;
     // The same with the layout's own direction from left to right in every language.
     QWidget* leftToRight(QLayout* inside) const;
-    // Room at both sides of the widget, which takes share parts of the width against one part each.
+    // Room at both sides of the widget, which takes share parts of the width against one part each; on an upright
+    // window three times as many.
     QWidget* inMiddle(QWidget* inside, int share) const;
     // role: card, well, notice, alarm or success.
     Card makeCard(const char* role, Pad pad, Space gap = Space::Small) const;

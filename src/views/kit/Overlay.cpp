@@ -2,6 +2,7 @@
 
 #include "views/kit/Keyboard.h"
 #include "views/kit/ScreenReader.h"
+#include "views/kit/Scroller.h"
 
 #include <QApplication>
 #include <QEvent>
@@ -24,6 +25,11 @@ Overlay::Overlay(const Theme& theme, QWidget* parent, std::initializer_list<Item
     const Card card = makeCard("card", Pad::Wide, Space::Wide);
     m_card = card.frame;
     m_column = card.column;
+    if (theme.scrolls()) {
+        m_column = inColumn(Space::Wide);
+        card.column->addWidget(inScroller(inBox(m_column), m_card));
+        m_column->parentWidget()->installEventFilter(this);
+    }
     add(*m_column, items);
     setFocusPolicy(Qt::StrongFocus);
     parent->installEventFilter(this);
@@ -102,9 +108,13 @@ void Overlay::place() {
     if (!m_filling) {
         static constexpr int widths[] = {640, 780, 920}; // of a 1024 by 768 window
         const int width = std::min(m_theme.px(widths[static_cast<int>(m_width)]), available.width());
-        int height = m_card->layout()->hasHeightForWidth() ? m_card->layout()->totalHeightForWidth(width)
-                                                           : m_card->sizeHint().height();
-        height = std::max(height, m_card->minimumSizeHint().height());
+        // A scroller has no height of its own: it takes that of what it holds.
+        QWidget& inside = *m_column->parentWidget();
+        const QMargins around =
+            &inside == m_card ? QMargins() : m_card->layout()->contentsMargins() + m_card->contentsMargins();
+        const int inner = width - around.left() - around.right();
+        int height = m_column->hasHeightForWidth() ? m_column->totalHeightForWidth(inner) : inside.sizeHint().height();
+        height = std::max(height, inside.minimumSizeHint().height()) + around.top() + around.bottom();
         wanted = {width, std::min(height, available.height())};
     }
     m_card->setGeometry((width() - wanted.width()) / 2, (height() - wanted.height()) / 2, wanted.width(),
@@ -115,6 +125,8 @@ void Overlay::place() {
 bool Overlay::eventFilter(QObject* watched, QEvent* event) {
     if (watched == parentWidget() && event->type() == QEvent::Resize && m_open)
         setGeometry(parentWidget()->rect());
+    if (watched == m_column->parentWidget() && event->type() == QEvent::LayoutRequest)
+        place();
     return QWidget::eventFilter(watched, event);
 }
 
@@ -140,6 +152,8 @@ bool Overlay::focusNextPrevChild(bool next) {
         if (at != this && isAncestorOf(at) && !at->focusProxy() && at->isVisible() && at->isEnabled() &&
             (at->focusPolicy() & Qt::TabFocus)) {
             at->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+            if (auto* scroller = m_card->findChild<QScrollArea*>({}, Qt::FindDirectChildrenOnly))
+                scroller->ensureWidgetVisible(at);
             return true;
         }
     }

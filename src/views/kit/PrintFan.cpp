@@ -28,7 +28,7 @@ void PrintFan::setPrints(std::vector<QImage> prints) {
 }
 
 QSize PrintFan::sizeHint() const {
-    return {m_theme.px(340), m_theme.px(170)};
+    return m_theme.isTall() ? QSize(m_theme.px(560), m_theme.px(280)) : QSize(m_theme.px(340), m_theme.px(170));
 }
 
 QSize PrintFan::minimumSizeHint() const {

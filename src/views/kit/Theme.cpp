@@ -96,14 +96,16 @@ QString withCodesApart(const QString& line) {
 
 } // namespace
 
-double Theme::factorFor(QSize window) {
-    const double fit = std::min(window.width() / 1024.0, window.height() / 768.0);
+Theme::Fit Theme::fitFor(QSize window) {
+    const bool tall = window.height() * 4 >= window.width() * 5;
+    const QSizeF page = tall ? QSizeF(900, 1500) : QSizeF(1024, 768);
+    const double fit = std::min(window.width() / page.width(), window.height() / page.height());
     // Steps of a twentieth, so that dragging the window's edge does not build the page anew at each pixel.
-    return std::clamp(std::floor(fit * 20.0) / 20.0, 0.75, 3.0);
+    return {std::clamp(std::floor(fit * 20.0) / 20.0, 0.6, 3.0), tall};
 }
 
 int Theme::px(double length) const {
-    return length == 0 ? 0 : std::max(1, static_cast<int>(std::lround(length * m_factor)));
+    return length == 0 ? 0 : std::max(1, static_cast<int>(std::lround(length * factor())));
 }
 
 int Theme::size(Space space) const {
@@ -180,6 +182,9 @@ QString Theme::styleSheet() const {
     const int border = 2 * edge();
     std::map<QString, QString> values;
     for (const auto& [name, pixels] : {std::pair(u"target", target() - border),
+                                       {u"tall", std::max(least() - border, px(52))},
+                                       {u"least", least()},
+                                       {u"leastKey", least() - border},
                                        {u"row", target()},
                                        {u"key", key() - border},
                                        {u"halfKey", key() / 2}})
@@ -212,7 +217,7 @@ QString Theme::styleSheet() const {
         return {};
     const QString sheet = QString::fromUtf8(file.readAll());
     static const QRegularExpression placeholder(
-        u"@(\\d+)|\\$(target|row|halfKey|key|edge|mark|off|bareOff|bare|quiet|text[A-Z]\\w+|[A-Z]\\w+)"_s);
+        u"@(\\d+)|\\$(target|tall|leastKey|least|row|halfKey|key|edge|mark|off|bareOff|bare|quiet|text[A-Z]\\w+|[A-Z]\\w+)"_s);
     QString result;
     qsizetype from = 0;
     for (auto it = placeholder.globalMatch(sheet); it.hasNext();) {

@@ -7,6 +7,7 @@
 #include <QPixmap>
 #include <QString>
 
+#include <algorithm>
 #include <map>
 #include <utility>
 
@@ -24,7 +25,8 @@ enum class IconSize { Small, Button, Line, Box, Page };
 // Widths and heights: of a small drawing, a short field, a wide one, a bar, a form.
 enum class Extent { Drawing, Field, WideField, Bar, Form };
 
-// The look of every page, in one place. Lengths are given for a window of 1024 by 768 and grow with it by one factor.
+// The look of every page, in one place. Lengths are given for a window of 1024 by 768, or for an upright one of 900 by
+// 1500, and grow with it by one factor.
 class Theme {
 public:
     enum class Look {
@@ -63,13 +65,20 @@ public:
     // To be called before a page is made: what is on the screen keeps the look that it has.
     static void setLook(Look look);
 
-    // The factor of the largest logical page that fits the window.
-    static double factorFor(QSize window);
+    struct Fit {
+        double factor = 1;
+        bool tall = false; // clearly taller than wide: what stands side by side stands one below the other
+        bool operator==(const Fit&) const = default;
+    };
+    // The largest logical page that fits the window.
+    static Fit fitFor(QSize window);
 
-    explicit Theme(double factor)
-        : m_factor(factor) {}
+    explicit Theme(Fit fit)
+        : m_fit(fit) {}
 
-    double factor() const { return m_factor; }
+    const Fit& fit() const { return m_fit; }
+    double factor() const { return m_fit.factor; }
+    bool isTall() const { return m_fit.tall; }
     int px(double length) const;
 
     int size(Space space) const;
@@ -77,16 +86,21 @@ public:
     int size(Extent extent) const;
     QMargins margins(Pad pad) const;
     int gap() const { return size(Space::Normal); }
-    int margin() const { return size(Space::Far); } // of a page
+    int margin() const { return size(isTight() ? Space::Wide : Space::Far); } // of a page
     int corner() const { return px(14); }
     int edge() const; // in pixels of the screen: the outline of a card and of what can be pressed
     Qt::PenStyle edgeStyle(bool enabled) const;
     int hair() const { return px(2); }  // a line that is to be noticed
     int thick() const { return px(3); } // a line around what is chosen
-    // No control that can be pressed is smaller than this, on any window.
-    int target() const { return px(48) < 44 ? 44 : px(48); }
+    // Below 800 by 600, where what does not fit scrolls.
+    bool scrolls() const { return factor() < smallest; }
+    // No control or row that can be pressed is smaller than this: a finger's width, and less below 800 by 600.
+    int least() const { return scrolls() ? 36 : 44; }
+    // Controls take more of the window than they would by its factor.
+    bool isTight() const { return px(48) < least(); }
+    int target() const { return std::max(least(), px(48)); }
     // Plus and minus of a small picture: as small as a target may be.
-    int key() const { return px(44) < 44 ? 44 : px(44); }
+    int key() const { return std::max(least(), px(44)); }
 
     // The sizes of text.
     enum class Type { Note, Small, Tall, Word, Body, Strong, Field, Large, Key, Title, Display, Number, Giant };
@@ -103,7 +117,8 @@ public:
     static void apply(QApplication& application);
 
 private:
-    double m_factor;
+    static constexpr double smallest = 0.75; // of a window of 800 by 600
+    Fit m_fit;
     mutable std::map<std::pair<QString, std::pair<int, QRgb>>, QPixmap> m_icons;
 };
 

@@ -74,7 +74,8 @@ QSize ToolButton::sizeHint() const {
 }
 
 QSize ToolButton::minimumSizeHint() const {
-    return {std::max(44, m_theme.px(m_size.width() * 0.8)), std::max(44, m_theme.px(m_size.height() * 0.9))};
+    return {std::max(m_theme.least(), m_theme.px(m_size.width() * 0.8)),
+            std::max(m_theme.least(), m_theme.px(m_size.height() * 0.9))};
 }
 
 void ToolButton::paintEvent(QPaintEvent*) {

@@ -24,8 +24,10 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// Four in a row, so that the large picture stands beside them.
-constexpr int columns = 4;
+// Four in a row, so that the large picture stands beside them; three where it stands above them.
+int columnsOf(const Theme& theme) {
+    return theme.isTall() ? 3 : 4;
+}
 
 // Width and height of a picture stay in one line of text.
 QString unbrokenSize(const QString& text) {
@@ -64,7 +66,8 @@ kyoskNewView::kyoskNewView(kyoskNew& page, const SessionState& state, const Them
     QWidget* grid = makeGrid();
     m_side = makeSide();
     // The small pictures stand on the left and run from left to right in both languages, as the page's texts say.
-    m_body->addWidget(leftToRight(inRow(Space::Wide, {{grid, 2}, {m_side, 1}})));
+    m_body->addWidget(leftToRight(across(theme.isTight() ? Space::Small : Space::Wide,
+                                         {{grid, theme.isTall() ? 3 : 2}, {m_side, 1}}, Upright::LastOnTop)));
     frame().content()->addWidget(body, 1);
     makeBars();
     makeQuestions();
@@ -86,11 +89,15 @@ QLayout* kyoskNewView::makeTopRow() {
     QLabel* range = centred(lineLabel(c.pageRange, "strong"));
     range->setMinimumWidth(theme().px(130));
     keepPlaceWhenHidden(*range);
-    return inRow(Space::Small, {{inColumn(Space::None, {title, m_folder}), 1}, chosen, m_previous, range, m_next});
+    QLayout* words = inColumn(Space::None, {title, m_folder});
+    if (theme().isTall())
+        return inColumn(Space::Small, {words, inRow(Space::Small, {chosen, Item::room(), m_previous, range, m_next})});
+    return inRow(Space::Small, {{words, 1}, chosen, m_previous, range, m_next});
 }
 
 QWidget* kyoskNewView::makeGrid() {
     QGridLayout* grid = inGrid(Space::Small);
+    const int columns = columnsOf(theme());
     for (int i = 0; i < static_cast<int>(cellsOfPage); ++i)
         grid->addWidget(makeCell(i), i / columns, i % columns);
     for (int i = 0; i < columns; ++i)
@@ -119,6 +126,7 @@ PictureCell* kyoskNewView::makeCell(int i) {
     if (i == 0)
         connect(cell, &PictureCell::resized, this, [this] { QTimer::singleShot(0, this, &kyoskNewView::fitCells); });
     connect(cell, &PictureCell::arrow, this, [this, i](int across, int down) {
+        const int columns = columnsOf(theme());
         const int column = i % columns + across;
         const int next = i + across + down * columns;
         if (column < 0 || column >= columns || next < 0 || next >= static_cast<int>(cellsOfPage))
@@ -160,10 +168,24 @@ QWidget* kyoskNewView::makeSide() {
     QPushButton* turn = button(c.Image4, Role::Plain, &kyoskNew::Image4_Click, u"rotate"_s);
     m_largeResolution = new ResolutionBadge(theme(), this);
     bind(m_largeResolution, c.largeResolution);
-    add(*picture.column, {{m_large, 1},
-                          centred(label(c.paperNote, "smallMuted")),
-                          {m_largeResolution, 0, Qt::AlignCenter},
-                          inRow(Space::Small, {{centred(label(c.Label6, "strong", unbrokenSize)), 1}, turn})});
+    QLabel* note = centred(label(c.paperNote, "smallMuted"));
+    QLabel* size = centred(label(c.Label6, "strong", unbrokenSize));
+    if (theme().isTall())
+        picture.column->addLayout(
+            inRow(Space::Normal,
+                  {{m_large, 3},
+                   {inColumn(Space::Normal,
+                             {Item::room(), size, note, {m_largeResolution, 0, Qt::AlignCenter}, turn, Item::room()}),
+                    2}}),
+            1);
+    else if (theme().isTight())
+        add(*picture.column, {{m_large, 1},
+                              m_about = inBox(inColumn(Space::None, {note, size})),
+                              {m_largeResolution, 0, Qt::AlignCenter},
+                              turn});
+    else
+        add(*picture.column,
+            {{m_large, 1}, note, {m_largeResolution, 0, Qt::AlignCenter}, inRow(Space::Small, {{size, 1}, turn})});
 
     m_offerButtons = {
         button(c.Command24, Role::Plain, &kyoskNew::Command24_Click),
@@ -179,9 +201,11 @@ QWidget* kyoskNewView::makeSide() {
     }
     QPushButton* branch = button(c.Image33, Role::Plain, &kyoskNew::Image33_Click, u"shop"_s);
     m_cardPlaces[1] = inRow(Space::None);
-    return inBox(
-        inColumn(Space::Small,
-                 {m_cardPlaces[1], centred(label(c.cardCopies, "strong")), {picture.frame, 1}, offer.frame, branch}));
+    QLabel* copies = centred(label(c.cardCopies, "strong"));
+    if (!theme().isTall())
+        return inBox(inColumn(Space::Small, {m_cardPlaces[1], copies, {picture.frame, 1}, offer.frame, branch}));
+    return inBox(inRow(Space::Normal, {{picture.frame, 2},
+                                       {inColumn(Space::Small, {m_cardPlaces[1], copies, offer.frame, branch}), 1}}));
 }
 
 void kyoskNewView::makeBars() {
@@ -419,6 +443,8 @@ void kyoskNewView::render() {
     renderCard();
     renderCells();
     m_large->show(c.Picture2);
+    if (m_about)
+        m_about->setVisible(!c.Picture66.visible); // the offer leaves the picture no room for its words
     m_largeResolution->display(c.largeResolution);
     setDirectedIcon(m_previous, Way::Back);
     setDirectedIcon(m_next, Way::Forwards);

@@ -52,6 +52,7 @@ private:
     QStackedLayout* m_body = nullptr;
     std::array<PictureCell*, cellsOfPage> m_cells{};
     LargePicture* m_large = nullptr;
+    QWidget* m_about = nullptr; // the large picture's words, where they may have to go
     ResolutionBadge* m_largeResolution = nullptr;
     QWidget* m_side = nullptr;
     std::array<QPushButton*, 3> m_offerButtons{};

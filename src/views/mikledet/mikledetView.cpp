@@ -110,10 +110,12 @@ QWidget* mikledetView::makeAppearance() {
 }
 
 QWidget* mikledetView::makeSymbols() {
-    QHBoxLayout* row = inRow(Space::Tight);
+    // In two lines where they would be narrower than a finger.
+    QGridLayout* grid = inGrid(Space::Tight);
+    const int columns = theme().isTall() || theme().isTight() ? KeyLayout::symbolKeys / 2 : KeyLayout::symbolKeys;
     for (int i = 0; i < KeyLayout::symbolKeys; ++i)
-        row->addWidget(key(KeyLayout::firstSymbol + i));
-    QWidget* box = leftToRight(row);
+        grid->addWidget(key(KeyLayout::firstSymbol + i), i / columns, i % columns);
+    QWidget* box = leftToRight(grid);
     bindName(box, c.Frame1);
     return box;
 }

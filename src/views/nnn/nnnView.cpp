@@ -83,7 +83,7 @@ void nnnView::placeTiles() {
         if (tile)
             m_tileGrid->removeWidget(tile);
     }
-    const int columns = wanted.size() <= 4 ? 2 : 3;
+    const int columns = theme().isTall() ? (wanted.size() <= 5 ? 1 : 2) : wanted.size() <= 4 ? 2 : 3;
     for (int i = 0; i < wanted.size(); ++i)
         m_tileGrid->addWidget(m_tiles[static_cast<std::size_t>(wanted[i])], i / columns, i % columns);
 }
@@ -106,7 +106,7 @@ QWidget* nnnView::makeDetails() {
     form.column->addLayout(
         inRow(Space::Normal, {checkBox(c.Check2, toPage(&nnn::Check2_Click)), Item::room(),
                               button(c.Command10, Role::Plain, &nnn::Command10_Click, u"memory"_s)}));
-    return inMiddle(inBox(inColumn(Space::None, {form.frame, Item::room()})), 4);
+    return inMiddle(inBox(inColumn(Space::None, {Item::room(theme().isTall() ? 1 : 0), form.frame, Item::room(2)})), 4);
 }
 
 QWidget* nnnView::makeOptions() {
@@ -126,8 +126,9 @@ QWidget* nnnView::makeOptions() {
     }
     m_moreSizes = comboBox(c.Combo1.rows, c.Combo1, toPage(&nnn::Combo1_Click));
     m_moreSizes->setMinimumWidth(theme().size(Extent::WideField));
-    sizes->addLayout(inColumn(Space::Normal, {Item::room(), m_moreSizes, label(c.Label4kpn, "muted"), Item::room()}),
-                     2);
+    QLabel* coupon = label(c.Label4kpn, "muted");
+    if (!theme().isTall())
+        sizes->addLayout(inColumn(Space::Normal, {Item::room(), m_moreSizes, coupon, Item::room()}), 2);
     auto* kinds = inRow(Space::Wide);
     for (std::size_t i = 0; i < c.Option3.size(); ++i) {
         auto* card = new DrawingCard(theme(), this,
@@ -141,10 +142,13 @@ QWidget* nnnView::makeOptions() {
         bindChoice(card, c.Option3[i], [this, i] { m_page.Option3_Click(static_cast<int>(i)); });
         kinds->addWidget(card, 2);
     }
-    kinds->addStretch(2);
-    QWidget* step = inBox(
-        inColumn(Space::Small,
-                 {label(c.LabelSizes, "large"), {sizes, 3}, Space::Tight, label(c.LabelKinds, "large"), {kinds, 2}}));
+    if (!theme().isTall())
+        kinds->addStretch(2);
+    QVBoxLayout* column = inColumn(Space::Small, {label(c.LabelSizes, "large"), {sizes, 3}});
+    if (theme().isTall())
+        column->addLayout(inRow(Space::Wide, {m_moreSizes, {coupon, 1}}));
+    add(*column, {Space::Tight, label(c.LabelKinds, "large"), {kinds, 2}});
+    QWidget* step = inBox(column);
     bind(new QWidget(step), c.Frame4);
     return step;
 }
@@ -160,14 +164,15 @@ QWidget* nnnView::makeBorders() {
             },
             {150, 140}, DrawingCard::Words::Small);
         bindChoice(card, c.Image13[at], [this, i] { m_page.Image13_MouseDown(i); });
-        grid->addWidget(card, i / 4, i % 4);
+        const int columns = theme().isTall() ? 3 : 4;
+        grid->addWidget(card, i / columns, i % columns);
     }
     const Card preview = makeCard("card", Pad::Normal);
     m_sample = new BorderSample(preview.frame);
     m_sample->setMinimumSize(theme().size(Extent::WideField), theme().size(Extent::Field));
     bind(u"Picture16"_s, m_sample, [this] { return QString::number(c.Picture16); });
     add(*preview.column, {{m_sample, 1}, centred(label(c.LabelPicture16, "strong"))});
-    QWidget* step = inBox(inRow(Space::Far, {{grid, 3}, {preview.frame, 1}}));
+    QWidget* step = inBox(across(Space::Far, {{grid, 3}, {preview.frame, 1}}, Upright::LastOnTop));
     bind(new QWidget(step), c.Picture4);
     return step;
 }
@@ -186,10 +191,11 @@ QWidget* nnnView::makeFit() {
         bindChoice(made, caption, toPage(clicked));
         return made;
     };
-    QWidget* step = inBox(inRow(Space::Far, {Item::room(),
-                                             {card(c.Option4, {4, 3}, &nnn::Option4_Click), 2, Qt::AlignVCenter},
-                                             {card(c.Option5, {3, 2}, &nnn::Option5_Click), 2, Qt::AlignVCenter},
-                                             Item::room()}));
+    const Qt::Alignment middle = theme().isTall() ? Qt::Alignment() : Qt::AlignVCenter;
+    QWidget* step = inBox(across(Space::Far, {Item::room(),
+                                              {card(c.Option4, {4, 3}, &nnn::Option4_Click), 2, middle},
+                                              {card(c.Option5, {3, 2}, &nnn::Option5_Click), 2, middle},
+                                              Item::room()}));
     bind(new QWidget(step), c.Picture5);
     return step;
 }
@@ -208,7 +214,9 @@ QWidget* nnnView::makeTerms() {
     hint.column->addLayout(inRow(Space::Normal, {{label(c.LabelTerms), 1},
                                                  button(c.Command30, Role::Quiet, &nnn::Command30_Click, u"close"_s)}));
     add(*terms.column, {label(c.LabelCheck1, "muted"), row, m_hint});
-    return inMiddle(inBox(inColumn(Space::Wide, {summary.frame, terms.frame, Item::room()})), 4);
+    return inMiddle(
+        inBox(inColumn(Space::Wide, {Item::room(theme().isTall() ? 1 : 0), summary.frame, terms.frame, Item::room(2)})),
+        4);
 }
 
 void nnnView::makeHeader() {

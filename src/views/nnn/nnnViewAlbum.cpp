@@ -33,10 +33,14 @@ nnnView::Album::Album(nnnView& view)
         m_panels->addWidget(inMiddle(made, share));
     };
     using enum AlbumDrawing;
-    choice(0, 12, 520, cards(m_shown.Combo4Godel, 3, {Spread}, {250, 200}, &AlbumPanels::Combo4Godel_Click));
-    choice(1, 5, 360, cards(m_shown.Combo4Cricha, 2, {Brown, Cream}, {340, 320}, &AlbumPanels::Combo4Cricha_Click));
-    choice(2, 12, 320,
-           cards(m_shown.Combo4Niyar, 3, {Glossy, Matte, Silk}, {290, 260}, &AlbumPanels::Combo4Niyar_Click));
+    choice(0, 12, m_theme.isTall() ? 900 : 520,
+           cards(m_shown.Combo4Godel, m_theme.isTall() ? 2 : 3, {Spread}, {250, 200}, &AlbumPanels::Combo4Godel_Click));
+    choice(1, 5, m_theme.isTall() ? 900 : 360,
+           cards(m_shown.Combo4Cricha, m_theme.isTall() ? 1 : 2, {Brown, Cream}, {340, 320},
+                 &AlbumPanels::Combo4Cricha_Click));
+    choice(2, 12, m_theme.isTall() ? 900 : 320,
+           cards(m_shown.Combo4Niyar, m_theme.isTall() ? 1 : 3, {Glossy, Matte, Silk}, {290, 260},
+                 &AlbumPanels::Combo4Niyar_Click));
     m_panels->addWidget(makeExtras());
     m_panels->addWidget(makeBill());
     for (int i = 0; i < m_panels->count(); ++i)
@@ -94,7 +98,7 @@ QWidget* nnnView::Album::makePhotographer() {
         {grid, inRow(Space::Normal, {checkBox(m_shown.Check5, &AlbumPanels::Check5_Click), Item::room(),
                                      m_view.button(m_shown.Command28, Role::Plain,
                                                    toAlbum(&AlbumPanels::Command28_Click), u"memory"_s)})});
-    return inMiddle(inBox(inColumn(Space::None, {card.frame, Item::room()})), 8);
+    return inMiddle(inBox(inColumn(Space::None, {Item::room(m_theme.isTall() ? 1 : 0), card.frame, Item::room(2)})), 8);
 }
 
 QWidget* nnnView::Album::makeKinds() {
@@ -105,7 +109,8 @@ QWidget* nnnView::Album::makeKinds() {
         const int i = static_cast<int>(at);
         m_kinds[at] = makeAlbumCard(m_theme, &m_view, drawings[at], {260, 160});
         m_view.bindChoice(m_kinds[at], m_shown.SoogAlb[at], [&album = m_album, i] { album.SoogAlb_Click(i); });
-        grid->addWidget(m_kinds[at], i / 3, i % 3);
+        const int columns = m_theme.isTall() ? 2 : 3;
+        grid->addWidget(m_kinds[at], i / columns, i % columns);
     }
     return inBox(inColumn(Space::Normal, {{grid, 1}, makeParents()}));
 }
@@ -128,21 +133,25 @@ QWidget* nnnView::Album::makeParents() {
     const Card card = makeCard("card", Pad::Slim);
     m_parents = card.frame;
     m_parents->setMinimumHeight(m_theme.target() + 2 * m_theme.gap());
-    card.column->addLayout(inRow(Space::Normal, {wanted, Item::room(), prompt, m_copies, m_parentSize}));
+    if (m_theme.isTall())
+        add(*card.column, {wanted, inRow(Space::Normal, {prompt, m_copies, Item::room(), m_parentSize})});
+    else
+        card.column->addLayout(inRow(Space::Normal, {wanted, Item::room(), prompt, m_copies, m_parentSize}));
     return m_parents;
 }
 
 QWidget* nnnView::Album::makeExtras() {
     using enum AlbumDrawing;
-    m_choices[3] = cards(m_shown.Combo4Tosefet, 4, {Nothing, Canvas, Plate, Perspex}, {215, 210},
+    m_choices[3] = cards(m_shown.Combo4Tosefet, m_theme.isTall() ? 2 : 4, {Nothing, Canvas, Plate, Perspex}, {215, 210},
                          &AlbumPanels::Combo4Tosefet_Click);
     const Card card = makeCard("card", Pad::Wide);
     auto* grid = inGrid(Space::Small);
+    const int columns = m_theme.isTall() ? 2 : 3;
     for (int i = 0; i < 6; ++i) {
         const auto at = static_cast<std::size_t>(i);
         grid->addWidget(
-            m_view.checkBox(m_shown.Check3[at], [&album = m_album, i](bool on) { album.Check3_Click(i, on); }), i / 3,
-            i % 3);
+            m_view.checkBox(m_shown.Check3[at], [&album = m_album, i](bool on) { album.Check3_Click(i, on); }),
+            i / columns, i % columns);
     }
     add(*card.column, {m_view.label(m_shown.LabelCheck3, "large"), grid});
     return inBox(inColumn(Space::Normal, {{m_choices[3], 1}, card.frame}));
@@ -154,12 +163,14 @@ QWidget* nnnView::Album::makeBill() {
     m_billExtras = words("body");
     m_billParents = words("body");
     add(*bill.column, {m_view.label(m_shown.Pic4Bil, "large"),
-                       inRow(Space::Far, {{m_bill, 1}, {m_billExtras, 1}, {m_billParents, 1}})});
+                       across(Space::Far, {{m_bill, 1}, {m_billExtras, 1}, {m_billParents, 1}})});
     const Card terms = makeCard("card", Pad::Wide);
     terms.column->addLayout(
         inRow(Space::Normal, {checkBox(m_shown.Check6, &AlbumPanels::Check6_Click), Item::room(),
                               m_view.button(m_shown.Command25, Role::Plain, &nnn::Command29_Click, u"document"_s)}));
-    return inMiddle(inBox(inColumn(Space::Normal, {bill.frame, terms.frame, Item::room()})), 12);
+    return inMiddle(
+        inBox(inColumn(Space::Normal, {Item::room(m_theme.isTall() ? 1 : 0), bill.frame, terms.frame, Item::room(2)})),
+        12);
 }
 
 QCheckBox* nnnView::Album::checkBox(const CheckCaption& caption, void (AlbumPanels::*clicked)(bool)) {

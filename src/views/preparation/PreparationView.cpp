@@ -35,7 +35,7 @@ PreparationView::PreparationView(PreparationPage& page, const SessionState& stat
                                                  m_trouble.frame,
                                                  Item::room(),
                                                  keep.frame});
-    frame().content()->addLayout(inRow(Space::Far, {{progress, 3}, {m_side, 2}}), 1);
+    frame().content()->addLayout(across(Space::Far, {{progress, 3}, {m_side, 2}}), 1);
     bind(m_sheet, c.Picture5);
     add(*m_sheetCard.column, {echo(c.Picture5, "smallMuted"), {m_sheet, 1}});
     frame().addStatus(m_total);

@@ -4,11 +4,11 @@
 #include "views/kit/Gauge.h"
 #include "views/kit/Overlay.h"
 #include "views/kit/PrintFan.h"
+#include "views/kit/Scroller.h"
 
 #include <QLabel>
 #include <QListWidget>
 #include <QProgressBar>
-#include <QScrollArea>
 
 #include <utility>
 
@@ -45,7 +45,8 @@ void SendingView::layOut(std::initializer_list<Item> lines, std::initializer_lis
     add(*progress, {centred(label(shown.nextSteps)), centred(label(shown.slip, "strong")), card.frame, Item::room(),
                     makeLeftOutCard()});
     add(*progress, troubles);
-    frame().content()->addLayout(inRow(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}), 1);
+    // On an upright page what is ordered stands above what happens to it.
+    frame().content()->addLayout(across(Space::Far, {{inBox(progress), 3}, {inBox(side), 2}}, Upright::LastOnTop), 1);
 }
 
 void SendingView::makeThanks(const Caption& prompt, const Caption& whole) {
@@ -109,7 +110,7 @@ void SendingView::addLabList(QGridLayout& to, const Caption& heading, const char
     made->setLayoutDirection(Qt::LeftToRight);
     made->setMinimumHeight(theme().px(LabBoxHeight));
     bindList(QString::fromUtf16(name), rows, made, shown);
-    QLabel* title = label(heading, "smallMuted");
+    QLabel* title = lineLabel(heading, "smallMuted");
     title->setBuddy(made);
     m_headed.emplace_back(&heading, made);
     const int column = to.columnCount() - (to.count() == 0 ? 1 : 0);
@@ -120,12 +121,9 @@ void SendingView::addLabList(QGridLayout& to, const Caption& heading, const char
 }
 
 Overlay* SendingView::makeLabPanel(std::initializer_list<Item> parts, QPushButton* close) {
-    auto* scroll = new QScrollArea(this);
-    scroll->setWidgetResizable(true);
-    scroll->setFrameShape(QFrame::NoFrame);
+    QScrollArea* scroll =
+        inScroller(inBox(inRow(Space::None, {{inColumn(Space::Normal, parts), 1}, Space::Normal})), this);
     scroll->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    scroll->setFocusPolicy(Qt::NoFocus);
-    scroll->setWidget(inBox(inRow(Space::None, {{inColumn(Space::Normal, parts), 1}, Space::Normal})));
     auto* panel = new Overlay(theme(), this, {{scroll, 1}});
     panel->setFilling();
     panel->addButton(close);

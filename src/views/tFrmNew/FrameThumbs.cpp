@@ -141,7 +141,7 @@ void FrameThumbs::resizeEvent(QResizeEvent* event) {
 void FrameThumbs::layOut() {
     // Room for the scroll bar is kept also while there is none: it would come and go with the cells' own size.
     const int width = (maximumViewportSize().width() - verticalScrollBar()->sizeHint().width() - 2) / across;
-    const QSize cell(width, std::max(44, width * 2 / 3 + m_theme.px(6)));
+    const QSize cell(width, std::max(m_theme.least(), width * 2 / 3 + m_theme.px(6)));
     if (gridSize() == cell)
         return;
     static_cast<Thumb*>(m_thumb)->cell = cell;

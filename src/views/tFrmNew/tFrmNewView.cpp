@@ -43,8 +43,12 @@ tFrmNewView::tFrmNewView(tFrmNew& page, PageChain& chain, const SessionState& st
     m_strip = makeStrip();
     m_behindPanel = new QWidget(this);
     m_behindPanel->hide();
-    add(*frame().content(),
-        {{inRow(Space::Small, {m_nearTools, {m_table, 1}, m_farTools}), 1}, m_strip, m_behindPanel});
+    if (theme.isTall())
+        add(*frame().content(),
+            {{m_table, 1}, inRow(Space::Small, {{m_nearTools, 1}, {m_farTools, 1}}), m_strip, m_behindPanel});
+    else
+        add(*frame().content(),
+            {{inRow(Space::Small, {m_nearTools, {m_table, 1}, m_farTools}), 1}, m_strip, m_behindPanel});
     makeTonePanel();
     makeTurnPanel();
     makeBars();
@@ -100,7 +104,8 @@ QWidget* tFrmNewView::makeTools() {
     QFrame* light = group(c.lightTitle, {makeLight()});
     QFrame* turns = group(c.turnTitle, {makeTurns()});
     QWidget* box = inBox(inColumn(Space::Small, {place, light, turns, Item::room()}));
-    box->setFixedWidth(theme().px(columnWidth));
+    if (!theme().isTall())
+        box->setFixedWidth(theme().px(columnWidth));
     return box;
 }
 
@@ -179,7 +184,8 @@ QWidget* tFrmNewView::makeFramesAndMore() {
     keepsItsPlace.setRetainSizeWhenHidden(true);
     m_frameTools->setSizePolicy(keepsItsPlace);
     QWidget* box = inBox(inColumn(Space::Small, {m_moreTools, {m_frameTools, 1}}));
-    box->setFixedWidth(theme().px(columnWidth));
+    if (!theme().isTall())
+        box->setFixedWidth(theme().px(columnWidth));
     return box;
 }
 
@@ -305,7 +311,8 @@ void tFrmNewView::render() {
 
 void tFrmNewView::setCoveredHeight(int pixels) {
     // What lies above the bottom bar; the bar itself is covered as well.
-    const int bar = height() - frame().content()->parentWidget()->geometry().bottom() - 1;
+    const QWidget* body = frame().content()->parentWidget();
+    const int bar = height() - body->mapTo(this, QPoint(0, body->height())).y();
     const int room = pixels == 0 ? 0 : std::max(1, pixels - bar);
     if (m_covered == room)
         return;

@@ -234,13 +234,14 @@ std::optional<PanelForms> tFrmNewView::turnForms() const {
     return forms;
 }
 
-// The operator's tools lie over the small pictures, the turns beside the paper, the tones over the frames below their
-// button: never over the picture.
+// The operator's tools lie over the small pictures, on an upright page over the table's own end, the turns beside the
+// paper, the tones over the frames below their button: never over the picture.
 void tFrmNewView::placePanels() {
     if (!m_operatorPanel || isDetached())
         return;
     const QPoint corner = m_table->mapTo(this, QPoint());
-    const int bottom = m_strip->mapTo(this, QPoint(0, m_strip->height())).y();
+    const QWidget& last = theme().isTall() ? static_cast<QWidget&>(*m_table) : *m_strip;
+    const int bottom = last.mapTo(this, QPoint(0, last.height())).y();
     const QSize wanted = m_operatorPanel->sizeHint();
     const QSize size(std::max(wanted.width(), m_table->width()), wanted.height());
     m_operatorPanel->setGeometry(corner.x() + (m_table->width() - size.width()) / 2, bottom - size.height(),

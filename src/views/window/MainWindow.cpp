@@ -13,6 +13,7 @@
 
 #include <QApplication>
 #include <QCloseEvent>
+#include <QScreen>
 #include <QTimer>
 
 #include <algorithm>
@@ -24,13 +25,13 @@ using namespace Qt::StringLiterals;
 MainWindow::MainWindow(PageChain& chain, const SessionState& state)
     : m_chain(chain)
     , m_state(state)
-    , m_theme(std::make_unique<Theme>(1.0))
+    , m_theme(std::make_unique<Theme>(Theme::Fit{}))
     , m_keyboard(new FieldKeyboard(*this, *m_theme, state))
     , m_presses(new PressFilter(this)) {
     setObjectName(u"lumoraWindow"_s);
     setAttribute(Qt::WA_StyledBackground);
     setWindowTitle(u"Lumora"_s);
-    setMinimumSize(800, 600);
+    setMinimumSize(QSize(640, 480).boundedTo(screen()->availableSize()));
     m_stack = new LiftedStack(this);
     m_stack->setContentsMargins(0, 0, 0, 0);
     setStyleSheet(m_theme->styleSheet());
@@ -161,17 +162,16 @@ void MainWindow::pageUnloaded(Page* page) {
 void MainWindow::resizeEvent(QResizeEvent*) {
     placePanel();
     m_keyboard->place();
-    const double factor = Theme::factorFor(size());
-    if (factor != m_theme->factor())
+    if (Theme::fitFor(size()) != m_theme->fit())
         QTimer::singleShot(0, this, &MainWindow::rebuild);
 }
 
 void MainWindow::rebuild() {
-    const double factor = Theme::factorFor(size());
-    if (factor == m_theme->factor())
+    const Theme::Fit fit = Theme::fitFor(size());
+    if (fit == m_theme->fit())
         return;
     m_keyboard->forget();
-    *m_theme = Theme(factor);
+    *m_theme = Theme(fit);
     setStyleSheet(m_theme->styleSheet());
     const Page* front = m_front ? &m_front->page() : nullptr;
     const Page* below = m_below ? &m_below->page() : nullptr;

@@ -24,7 +24,8 @@ struct SessionState;
 
 // The program's one window. It follows the page chain: the view of the page in front is shown, a view lives as long as
 // its page, and a page that nobody sees has none. A panel lies over the view that was shown before it. All sizes of a
-// view come from one factor, which follows the window; when it changes, the views are built anew from their pages.
+// view come from one factor and shape, which follow the window; when they change, the views are built anew from their
+// pages.
 class MainWindow : public QWidget {
     Q_OBJECT
 public:

@@ -1,5 +1,7 @@
 #include "views/window/PageFrame.h"
 
+#include "views/kit/Scroller.h"
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -15,9 +17,14 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     name->setText(u"Lumora"_s);
     auto* mark = new QLabel(header);
     mark->setPixmap(theme.icon(u"lumora"_s, theme.px(38), Theme::Colour::Primary));
-    auto* headerRow = inRow(Space::Normal, {mark, name, {m_steps, 1}, m_headerActions});
-    headerRow->setContentsMargins(theme.margin(), theme.size(Space::Small), theme.margin(), theme.size(Space::Small));
-    header->setLayout(headerRow);
+    // An upright page has the steps and what is counted in lines of their own.
+    QBoxLayout* headerRows =
+        theme.isTall()
+            ? static_cast<QBoxLayout*>(
+                  inColumn(Space::Tight, {inRow(Space::Normal, {mark, name, Item::room(), m_headerActions}), m_steps}))
+            : inRow(Space::Normal, {mark, name, {m_steps, 1}, m_headerActions});
+    headerRows->setContentsMargins(theme.margin(), theme.size(Space::Small), theme.margin(), theme.size(Space::Small));
+    header->setLayout(headerRows);
     m_header = header;
 
     m_title = words("title");
@@ -31,19 +38,26 @@ PageFrame::PageFrame(const Theme& theme, QWidget* parent)
     auto* body = new QWidget(this);
     m_content->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.gap());
     body->setLayout(m_content);
+    QWidget* shown = body;
+    if (theme.scrolls())
+        shown = inScroller(body, this);
 
     m_secondary = inRow(Space::Normal);
     m_status = inRow(Space::Normal);
     m_main = inRow(Space::Normal);
     auto* bar = new QFrame(this);
     setRole(bar, "bar");
-    auto* barRow = inRow(Space::Normal, {m_secondary, Item::room(), m_status, Item::room(), m_main});
-    barRow->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.gap());
-    bar->setLayout(barRow);
+    QBoxLayout* barRows =
+        theme.isTall() ? static_cast<QBoxLayout*>(
+                             inColumn(Space::Normal, {inRow(Space::None, {Item::room(), m_status, Item::room()}),
+                                                      inRow(Space::Normal, {m_secondary, Item::room(), m_main})}))
+                       : inRow(Space::Normal, {m_secondary, Item::room(), m_status, Item::room(), m_main});
+    barRows->setContentsMargins(theme.margin(), theme.gap(), theme.margin(), theme.gap());
+    bar->setLayout(barRows);
     bar->setMinimumHeight(theme.px(58) + 2 * theme.gap() + 2);
     m_bar = bar;
 
-    setLayout(inColumn(Space::None, {m_header, m_titleBlock, {body, 1}, m_bar}));
+    setLayout(inColumn(Space::None, {m_header, m_titleBlock, {shown, 1}, m_bar}));
     layout()->setContentsMargins(0, 0, 0, 0);
 }
 

@@ -14,7 +14,7 @@ using namespace Qt::StringLiterals;
 void showStartFailure(const QString& text) {
     if (QGuiApplication::platformName() == u"offscreen"_s || QGuiApplication::platformName() == u"minimal"_s)
         return;
-    const Theme theme(1.0);
+    const Theme theme(Theme::Fit{});
     QWidget window;
     window.setObjectName(u"lumoraWindow"_s);
     window.setAttribute(Qt::WA_StyledBackground);
