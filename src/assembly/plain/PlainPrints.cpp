@@ -46,9 +46,11 @@ void PlainPrints::beginSheet(int cells) {
 
 Result<Bitmap> PlainPrints::nextSmall(const Waiting& whileWaiting) {
     Made made = m_making->take(whileWaiting);
-    if (made.print && *made.print)
+    std::optional<Result<QByteArray>>& ready = m_ready[static_cast<std::size_t>(m_nextSmall++)];
+    if (made.print && *made.print) { // else tried again at its own step: a card may be back by then
         m_readyBytes += (*made.print)->size();
-    m_ready[static_cast<std::size_t>(m_nextSmall++)] = std::move(made.print);
+        ready = std::move(made.print);
+    }
     return std::move(made.small);
 }
 

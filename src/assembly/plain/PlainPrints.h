@@ -66,7 +66,6 @@ private:
     qsizetype m_readyBytes = 0;
     int m_nextSmall = 0;
     std::vector<int> m_left; // the lines whose prints are made behind the sheet
-    std::size_t m_nextLeft = 0;
     MemoryShare m_memory;
     std::unique_ptr<MakingSmall> m_making; // declared last, since their threads read the memory above
     std::unique_ptr<Making> m_makingLeft;
