@@ -1,6 +1,8 @@
 #pragma once
 
 #include "common/DrivePath.h"
+#include "common/Result.h"
+#include "platform/files/HostPath.h"
 
 #include <QString>
 
@@ -23,6 +25,10 @@ public:
     enum class Offer { Pictures, EveryFile };
     virtual DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
                                Offer offer = Offer::Pictures) = 0;
+
+    // Shows an HTML file of this machine over the page and returns at once; nothing of it leads out of it. Fails when
+    // it can't be read.
+    virtual Result<void> showText(const HostPath& file, const QString& title) = 0;
 
     // A question or the picker waits for a person.
     virtual bool isWaiting() const { return false; }

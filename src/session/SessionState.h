@@ -3,6 +3,7 @@
 #include "common/DoorRules.h"
 #include "common/DrivePath.h"
 #include "common/KioskRules.h"
+#include "common/LabTexts.h"
 #include "platform/line/Mail.h"
 
 #include <QDateTime>
@@ -276,6 +277,7 @@ struct SessionState {
     int waitingOrders = 0; // how many there are, as the start page counted them last
     QString slipTrouble;   // why the last slip was not printed, in the machine's words; for the staff
     KioskRules kiosk;
+    LabTexts texts;
     bool staff = false; // on a kiosk: the staff has given its code
 
     ClientProfile profile;

@@ -1,8 +1,8 @@
 #include "start/hatchala.h"
 
 #include "platform/files/Files.h"
+#include "session/LabPages.h"
 #include "session/PageChain.h"
-#include "session/WebPages.h"
 #include "session/lab/ClientProfile.h"
 
 #include <utility>
@@ -129,12 +129,12 @@ void hatchala::chooseShop(int row) {
 
 void hatchala::openPriceList() {
     loadProfile();
-    WebPages(m_state, m_platform).open(m_state.profile.PriceListUrl);
+    LabPages(m_state, m_platform).openPriceList();
 }
 
 void hatchala::openSite() {
     loadProfile();
-    WebPages(m_state, m_platform).open(m_state.profile.SiteUrl);
+    LabPages(m_state, m_platform).openSite();
 }
 
 void hatchala::leaveProgram() {

@@ -105,6 +105,7 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
     checkDisk();
     checkFrames();
     checkFonts();
+    checkTexts();
     checkDoor();
     checkPrinter();
     checkClock();
@@ -181,6 +182,16 @@ void StationCheck::checkFrames() {
         tell(Look, u"frames"_s, u"none: the editor offers no frame"_s,
              u"put the lab's frames into %1, a folder for each category"_s.arg(
                  toText(m_files.host(folder).ok() ? *m_files.host(folder) : m_dataFolder)));
+}
+
+void StationCheck::checkTexts() {
+    const LabTexts& texts = m_lab.deployment.texts;
+    for (const QString& file : {texts.terms, texts.priceList, texts.help}) {
+        if (!file.isEmpty() && !QFile(file).open(QIODevice::ReadOnly))
+            tell(
+                Look, u"texts"_s, u"%1 can't be read: customers are told to ask the staff"_s.arg(file),
+                u"compare the keys of [Texts] with where the files lie; the program's user must be able to read them"_s);
+    }
 }
 
 void StationCheck::checkFonts() {

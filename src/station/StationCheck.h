@@ -43,6 +43,7 @@ private:
     void checkDisk();
     void checkFrames();
     void checkFonts();
+    void checkTexts();
     void checkDoor();
     void checkPrinter();
     void checkClock();

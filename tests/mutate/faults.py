@@ -207,7 +207,7 @@ FAULTS = {
     'src/platform/line/HttpCall.cpp': [
         F('asking.method != Request::HTTP_HEAD && received < answer.length.value_or(received)', 'false', 'half a list is believed', seen=True),
         F('answer.status >= 307', 'true', 'a post that was sent elsewhere counts as arrived'),
-        F('hostAndPort(to->host) == hostAndPort(from.host)', 'true', 'an order follows to a foreign server'),
+        F('hostAndPort(*to) == hostAndPort(from)', 'true', 'an order follows to a foreign server'),
         F("c == ' ' || c == '\\r' || c == '\\n' || c == '\\0'", "c == ' '", 'a line break in an address is a request of its own')],
     'src/platform/line/MailText.cpp': [F('"filename*=UTF-8\'\'" + name.toUtf8().toPercentEncoding()', '"filename=\\"" + name.toUtf8() + \'"\'',
                                          'a package arrives under a garbled name')],

@@ -39,7 +39,8 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               "BorderPage = no\nFitPage = yes\nOptionalMail = yes\nLocalStation = yes\nExtraTile = yes\n"
               "[Mail]\nServer = mail.lab.example\nPort = 2525\nUser = a@b\nPassword = x^y\nTls = TLS\n"
               "From = kiosk@lab.example\nTo = o'neil+orders@lab.example\n"
-              "[Operator]\nArea = no\nEditor = yes\n[Look]\nContrast = yes\n[Door]\nCards = Watched\n[Kiosk]\nWaiting "
+              "[Operator]\nArea = no\nEditor = yes\n[Look]\nContrast = yes\n[Texts]\nHelp = "
+              "/srv/lab/עזרה.html\n[Door]\nCards = Watched\n[Kiosk]\nWaiting "
               "= yes\nKeyboard = Auto\n"
               "Mode = yes\nIdleSeconds = 3600\nKeepDays = 7\nKeepLogDays = 9999\nPrinter = slips\n[Log]\nKeep = yes\n"
               "[Shops]\nShop2Phone = 03-5\n"
@@ -54,6 +55,7 @@ TEST(LabFileTest, ReadsKeysOfEverySection) {
               QStringList({"127.0.0.1:2121", " a;b#c=d ", "א", "20/30", "", "20/30", "03-5", "North", "2nd floor",
                            "משלוח לבית"}));
     EXPECT_EQ(profile.JppChunks, 32767);
+    EXPECT_EQ(lab.texts.help, u"/srv/lab/עזרה.html");
     SessionState state;
     LoadDefaultProfile(state, lab);
     EXPECT_TRUE(state.coupon.SmallCount == 220 && state.coupon.LargeCount == 3);

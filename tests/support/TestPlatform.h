@@ -35,7 +35,13 @@ public:
         return picks.isEmpty() ? DrivePath() : picks.takeFirst();
     }
 
+    Result<void> showText(const HostPath& file, const QString& title) override {
+        texts += toText(file) + u'|' + title;
+        return {};
+    }
+
     QStringList messages;
+    QStringList texts;
     QStringList questions;
     QStringList questionTitles;
     QStringList pickRequests;

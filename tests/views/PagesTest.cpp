@@ -10,8 +10,15 @@
 #include "session/SessionState.h"
 #include "session/Workspace.h"
 #include "views/kit/Theme.h"
+#include "views/window/DoubledPress.h"
+#include "views/window/MainWindow.h"
+#include "views/window/ScreenDialogs.h"
 
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
 #include <QTest>
+#include <QTextBrowser>
 #include <QTimer>
 
 #include <algorithm>
@@ -181,6 +188,50 @@ TEST_P(PageLook, HasNoFaultFromThePhotographerOfAnAlbumToTheClosingPanel) {
     walk.pick(u"kyoskNew"_s, u"Image5"_s);
     go(walk, u":48-album-pictures Command24 Image7 :49-album-closing"_s);
 }
+
+class LabTextLook : public PageLook {};
+
+// Of a terms.html beside a picture, which names things outside of its folder too.
+TEST_P(LabTextLook, OpensInsideTheProgramAndLeadsNowhere) {
+    const QTemporaryDir lab;
+    ASSERT_TRUE(QDir(lab.path()).mkdir(u"texts"_s));
+    const auto write = [&](const QString& name, const QString& text) {
+        QFile file(lab.filePath(name));
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly) && file.write(text.toUtf8()) > 0);
+    };
+    QImage picture(2000, 300, QImage::Format_RGB32);
+    picture.fill(QColor(20, 110, 115));
+    ASSERT_TRUE(picture.save(lab.filePath(u"texts/prints.png"_s)) && picture.save(lab.filePath(u"outside.png"_s)));
+    const QString rest = u"<p><img src='prints.png'><img src='../outside.png'></p>"_s +
+                         u"<p>Lumora 2026. 10/15, 13/18, 20/30.</p>"_s.repeated(30);
+    write(u"texts/terms.html"_s,
+          u"<h1>תנאי ההזמנה</h1><p>ההזמנה נשלחת <a href='http://lab.example/'>למעבדה</a>.</p>"_s + rest);
+    write(u"texts/terms.en.html"_s,
+          u"<h1>Terms</h1><p>The order goes <a href='http://lab.example/'>to the lab</a>.</p>"_s + rest);
+    const QString terms = lab.filePath(u"texts/terms.html"_s);
+    Walk walk(GetParam(),
+              u"[Texts]\nTerms = %1\nPriceList = %1\nHelp = %2\n"_s.arg(terms, lab.filePath(u"gone.html"_s)));
+    walk.go(u"Image11"_s);
+    auto& text = dynamic_cast<QTextBrowser&>(walk.control(u"labText"_s));
+    look(walk, u"16-text"_s);
+    EXPECT_TRUE(text.toPlainText().startsWith(GetParam().english ? u"Terms"_s : u"תנאי"_s));
+    EXPECT_LE(text.document()->idealWidth(), text.viewport()->width());
+    EXPECT_TRUE(text.loadResource(QTextDocument::ImageResource, QUrl(u"../outside.png"_s)).value<QImage>().isNull());
+    Q_EMIT text.anchorClicked(QUrl(u"http://lab.example/"_s));
+    EXPECT_TRUE(text.toPlainText().contains(u"2026"_s));
+    const auto close = [&] {
+        QTest::mouseClick(&walk.control(u"textClose"_s), Qt::LeftButton);
+        walk.program().window().presses().rest();
+    };
+    close();
+    walk.go(toDetails + toOptions + toBorder + toTerms + u"Command29"_s);
+    EXPECT_TRUE(walk.control(u"textPanel"_s).isVisible());
+    close();
+    walk.go(toPictures + u"Image6"_s);
+    EXPECT_FALSE(walk.program().dialogs().frontText().isEmpty()) << "the help can't be read";
+}
+
+INSTANTIATE_TEST_SUITE_P(Screens, LabTextLook, PageLook::screens(), PageLook::nameOf);
 
 INSTANTIATE_TEST_SUITE_P(Screens, PageLook, PageLook::screens(), PageLook::nameOf);
 

@@ -14,9 +14,9 @@
 #include "platform/Dialogs.h"
 #include "platform/Machine.h"
 #include "platform/files/Drives.h"
+#include "session/LabPages.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "session/WebPages.h"
 #include "session/Workspace.h"
 
 // What the customer does on the page. nnnSteps.cpp has the steps and what each shows, nnnTexts.cpp what the page says.
@@ -322,7 +322,7 @@ void nnn::takeFit(const CheckCaption& taken) {
 // --- terms, and on to the pictures ---
 
 void nnn::readTerms() {
-    WebPages(m_state, m_platform).open(m_state.profile.SiteUrl);
+    LabPages(m_state, m_platform).openTerms();
 }
 
 void nnn::closeTermsHint() {

@@ -3,13 +3,15 @@
 #include "common/HostFile.h"
 
 #include <QBuffer>
-#include <QFile>
+#include <QIODevice>
 #include <QImageReader>
 #include <QtEndian>
 
 #include <algorithm>
 #include <cerrno>
 #include <mutex>
+
+#include <unistd.h>
 
 namespace lumora {
 
@@ -59,6 +61,48 @@ Result<void> checkBmp(PictureInput& input, const QByteArray& bytes) {
     return {};
 }
 
+// A file as a device that makes no call but pread(), as the door allows no other inside, and that remembers
+// what could not be read: Qt leaves the rest of a BMP black and calls it whole.
+class InputDevice : public QIODevice {
+public:
+    explicit InputDevice(const PictureInput& input)
+        : m_input(input) {}
+    qint64 size() const override { return m_input.size(); }
+    bool seek(qint64 to) override {
+        m_at = to;
+        return QIODevice::seek(to);
+    }
+    bool wasCut() const { return m_cut; }
+    int error() const { return m_error; }
+
+protected:
+    qint64 readData(char* target, qint64 most) override {
+        const qint64 wanted = std::min(most, size() - m_at);
+        qint64 got = 0;
+        while (got < wanted) {
+            const ssize_t part =
+                ::pread(m_input.descriptor(), target + got, static_cast<std::size_t>(wanted - got), m_at + got);
+            if (part < 0 && errno == EINTR)
+                continue;
+            if (part <= 0) {
+                m_cut = true;
+                m_error = part < 0 ? errno : 0;
+                return -1;
+            }
+            got += part;
+        }
+        m_at += got;
+        return got;
+    }
+    qint64 writeData(const char* /*bytes*/, qint64 /*count*/) override { return -1; }
+
+private:
+    const PictureInput& m_input;
+    qint64 m_at = 0;
+    bool m_cut = false;
+    int m_error = 0;
+};
+
 // Of a BMP file, which may have 150 MB, only the headers are read ahead; Qt takes the rows from the file one by one.
 template <class Value, class Use>
 Result<Value> withReader(PictureInput& input, const Use& use) {
@@ -72,12 +116,11 @@ Result<Value> withReader(PictureInput& input, const Use& use) {
     if (!bytes)
         return bytes.failure();
     QBuffer buffer(&*bytes);
-    QFile file;
+    InputDevice file(input);
     if (bmp) {
         if (auto checked = checkBmp(input, *bytes); !checked)
             return checked.failure();
-        if (!file.open(input.descriptor(), QIODevice::ReadOnly) || !file.seek(0))
-            return fileFailure(input.path(), u"can't be read"_s, errno);
+        file.open(QIODevice::ReadOnly | QIODevice::Unbuffered);
     } else {
         buffer.open(QIODevice::ReadOnly);
     }
@@ -88,7 +131,12 @@ Result<Value> withReader(PictureInput& input, const Use& use) {
         return pictureFailure(input.path(), Failure::Kind::Damaged, u"the picture is damaged or cut short"_s);
     if (auto bounds = checkPictureBounds(input.path(), size.width(), size.height()); !bounds)
         return bounds.failure();
-    return use(reader);
+    Result<Value> result = use(reader);
+    if (file.error() != 0)
+        return fileFailure(input.path(), u"can't be read"_s, file.error());
+    if (file.wasCut())
+        return pictureFailure(input.path(), Failure::Kind::Damaged, u"the picture is damaged or cut short"_s);
+    return result;
 }
 
 } // namespace

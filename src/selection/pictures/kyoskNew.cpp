@@ -10,9 +10,9 @@
 #include "platform/Dialogs.h"
 #include "platform/Platform.h"
 #include "selection/door/PictureDoor.h"
+#include "session/LabPages.h"
 #include "session/PageChain.h"
 #include "session/SessionState.h"
-#include "session/WebPages.h"
 #include "session/lab/MailDomains.h"
 
 #include <QTimer>
@@ -179,6 +179,8 @@ void kyoskNew::stay() {
 }
 
 void kyoskNew::turnHelp() {
+    if (!Frame2.visible && LabPages(m_state, m_platform).openHelp())
+        return;
     Frame2.visible = !Frame2.visible;
     Q_EMIT changed();
 }
@@ -189,7 +191,7 @@ void kyoskNew::turnLanguage() {
 }
 
 void kyoskNew::openPriceList() {
-    WebPages(m_state, m_platform).open(m_state.profile.PriceListUrl);
+    LabPages(m_state, m_platform).openPriceList();
 }
 
 } // namespace lumora

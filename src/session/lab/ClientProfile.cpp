@@ -53,6 +53,7 @@ void LoadDefaultProfile(SessionState& state, const Deployment& deployment) {
     state.Waiting = deployment.Waiting;
     state.screenKeys = deployment.screenKeys;
     state.kiosk = deployment.kiosk;
+    state.texts = deployment.texts;
     state.albumTail = deployment.albumTail;
     state.DeliveryChoiceMode = deployment.DeliveryChoiceMode;
     state.transfer.SugSheliach = deployment.SugSheliach;

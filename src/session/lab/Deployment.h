@@ -2,6 +2,7 @@
 
 #include "common/DoorRules.h"
 #include "common/KioskRules.h"
+#include "common/LabTexts.h"
 #include "platform/line/Encryption.h"
 #include "platform/line/Internet.h"
 #include "session/SessionState.h"
@@ -45,6 +46,7 @@ struct Deployment {
     AlbumTail albumTail = AlbumTail::Customer;
     DoorRules door;
     KioskRules kiosk;
+    LabTexts texts;
 
     QChar programLetter = u'C'; // letter of the program's own drive
     QString dataFolder;         // host folder behind it; empty: the user's data folder

@@ -27,7 +27,8 @@ bool printable(const LabKey& key, const QString& value) {
     const bool control = std::any_of(value.begin(), value.end(),
                                      [](QChar letter) { return letter.unicode() < 0x20 || letter.unicode() == 0x7F; });
     // A path of this machine is never written in the code page.
-    return !control && (key.section == u"Drives" || key.name == u"Ca" || AnsiCodePage::squeeze(value) == value);
+    return !control && (key.section == u"Drives" || key.section == u"Texts" || key.name == u"Ca" ||
+                        AnsiCodePage::squeeze(value) == value);
 }
 
 // Sets the value in the deployment. Returns what is wrong with the value, or an empty text. No message repeats a

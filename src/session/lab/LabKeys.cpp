@@ -33,6 +33,10 @@ auto at(T KioskRules::*field) {
     return [field](D& d) -> T& { return d.kiosk.*field; };
 }
 
+auto at(QString LabTexts::*field) {
+    return [field](D& d) -> QString& { return d.texts.*field; };
+}
+
 template <class T>
 auto at(T LineEncryption::*field) {
     return [field](D& d) -> T& { return d.encryption.*field; };
@@ -67,6 +71,11 @@ Kind text(Where where, const QString& allowed, const QString& pattern) {
 template <class Where>
 Kind shortText(Where where) {
     return text(where, u"up to 80 characters"_s, u"(?s).{0,80}"_s);
+}
+
+template <class Where>
+Kind file(Where where) {
+    return text(where, u"the whole path of a file, beginning with /, or empty"_s, u"(?s)(/.*)?"_s);
 }
 
 template <class Where>
@@ -195,9 +204,7 @@ std::vector<Row> rows() {
          words<FtpTls>(
              at(&LineEncryption::ftp), u"none, explicit or implicit"_s,
              {{u"none"_s, FtpTls::None}, {u"explicit"_s, FtpTls::Explicit}, {u"implicit"_s, FtpTls::Implicit}})},
-        {"Server", "Ca",
-         text(at(&LineEncryption::authorities), u"the whole path of a file, beginning with /, or empty"_s,
-              u"(?s)(/.*)?"_s)},
+        {"Server", "Ca", file(at(&LineEncryption::authorities))},
         {"Server", "Session",
          words<bool>(at(&D::keptFtpSession), u"each or kept"_s, {{u"each"_s, false}, {u"kept"_s, true}})},
         {"Server", "Lines", number(at(&D::ftpLines), 1, 4)},
@@ -254,6 +261,10 @@ std::vector<Row> rows() {
         {"Switches", "ExtraTile", yesNo<I>(at(&D::TmunatPaar), 1, 0)},
         {"Switches", "QuickOrder", yesNo<I>(at(&D::MinuyPaar), 1, 2)},
         {"Switches", "SplitPage", yesNo(at(&D::SplitPage), true, false)},
+
+        {"Texts", "Terms", file(at(&LabTexts::terms))},
+        {"Texts", "PriceList", file(at(&LabTexts::priceList))},
+        {"Texts", "Help", file(at(&LabTexts::help))},
 
         {"Guards", "Careful", yesNo(at(&D::Careful), true, false)},
 

@@ -43,6 +43,7 @@ private:
         void message(const QString&, const QString&) override {}
         bool ask(const QString&, const QString&) override { return false; }
         DrivePath pickFile(const QString&, const DrivePath&, const QString&, Offer) override { return {}; }
+        Result<void> showText(const HostPath&, const QString&) override { return {}; }
     };
 
     template <class P>

@@ -4,12 +4,21 @@
 #include "views/window/MainWindow.h"
 #include "views/window/MessagePanel.h"
 #include "views/window/PicturePicker.h"
+#include "views/window/TextPanel.h"
 
 #include <QEventLoop>
+#include <QFile>
+#include <QStringDecoder>
 
 namespace lumora {
 
 using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr qint64 largestText = 4 << 20; // bytes
+
+}
 
 ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Platform& platform)
     : m_window(window)
@@ -61,8 +70,34 @@ void ScreenDialogs::closeMessages() {
     }
 }
 
+Result<void> ScreenDialogs::showText(const HostPath& file, const QString& title) {
+    QFile text(toText(file));
+    if (!text.open(QIODevice::ReadOnly))
+        return Failure{Failure::Kind::NotFound, u"%1: %2"_s.arg(text.fileName(), text.errorString())};
+    const QByteArray bytes = text.read(largestText + 1);
+    if (text.error() != QFileDevice::NoError || bytes.size() > largestText)
+        return Failure{Failure::Kind::TooLarge, u"%1 can't be read, or is larger than 4 MB"_s.arg(text.fileName())};
+    QStringDecoder decoder = QStringDecoder::decoderForHtml(bytes);
+    closeText();
+    m_text = new TextPanel(m_window.theme(), &m_window, title, decoder(bytes), file.parent_path(),
+                           m_state.wording(u"חזרה"_s, u"Back"_s));
+    m_text->setLayoutDirection(m_state.english() ? Qt::LeftToRight : Qt::RightToLeft);
+    connect(m_text, &TextPanel::closed, this, &ScreenDialogs::closeText);
+    m_text->setOpen(true);
+    return {};
+}
+
+void ScreenDialogs::closeText() {
+    if (!m_text)
+        return;
+    m_text->setOpen(false);
+    m_text->deleteLater();
+    m_text = nullptr;
+}
+
 void ScreenDialogs::closeAll() {
     closeMessages();
+    closeText();
     for (QEventLoop* loop : m_answers)
         loop->quit();
 }

@@ -15,6 +15,7 @@ namespace lumora {
 
 class MainWindow;
 class MessagePanel;
+class TextPanel;
 struct Platform;
 struct SessionState;
 
@@ -31,6 +32,8 @@ public:
     bool ask(const QString& question, const QString& title = {}) override;
     DrivePath pickFile(const QString& prompt, const DrivePath& initialFolder, const QString& title,
                        Offer offer) override;
+
+    Result<void> showText(const HostPath& file, const QString& title) override;
 
     bool isWaiting() const override { return !m_answers.isEmpty(); }
     void closeAll() override;
@@ -56,6 +59,7 @@ private:
         QString title;
     };
     void showNext();
+    void closeText();
     QString closingText() const;
     void waitIn(QEventLoop& loop);
 
@@ -64,6 +68,7 @@ private:
     const Platform& m_platform;
     QList<Box> m_waiting;
     QPointer<MessagePanel> m_panel;
+    QPointer<TextPanel> m_text;
     QList<QEventLoop*> m_answers; // loops that wait for one; a loop's box has said no as long as nobody has answered
 };
 
