@@ -103,7 +103,9 @@ Page* Walk::find(PageId id) {
 
 void Walk::settle(int milliseconds) {
     QTest::qWait(milliseconds);
-    m_program->window().renderNow(); // a busy machine may not have come to it in that time
+    // A busy machine may not have come to it in that time, nor to laying out what the page now says.
+    m_program->window().renderNow();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
     m_program->window().presses().rest();
 }
 
