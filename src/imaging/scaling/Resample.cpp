@@ -261,7 +261,7 @@ Result<QByteArray> readResampledToJpeg(JpegReader& reader, PictureSize size, int
     const int denominator = decodeDenominator(reader.size(), size);
     Result<void> read;
     Bitmap pixels = small != nullptr && reader.hasPlanes() ? unfilled(small->size) : Bitmap();
-    if (pixels.isNull()) {
+    if (small == nullptr || pixels.isNull()) {
         read = reader.readPlanes(denominator, taker);
     } else {
         BitmapTaker smallTaker(reader.size(), small->size, wholeOf(small->size), pixels, kernels);

@@ -29,21 +29,23 @@ void writeMeans(const std::uint16_t* sums, int width, int step, unsigned char* c
     constexpr int area = Side * Side * Parts * Parts;
     const float blocksAStep = 1.0F / static_cast<float>(step * area);
     for (int block = 0; block < width / (Side * Parts); ++block, sums += Side * Parts) {
-        std::array<int, Parts * Parts> part{};
+        std::array<int, Parts * Parts> parts{};
+        auto* part = parts.data();
         int whole = 0;
         for (int y = 0; y < Parts; ++y) {
             for (int x = 0; x < Parts; ++x) {
                 int sum = 0;
                 for (int k = 0; k < Side; ++k)
                     sum += sums[y * width + x * Side + k];
-                part[static_cast<std::size_t>(y * Parts + x)] = sum;
+                *part++ = sum;
                 whole += sum;
             }
         }
         const int lost = lostToRounding(whole, area, step, blocksAStep) + area / 2;
+        part = parts.data();
         for (int y = 0; y < Parts; ++y) {
             for (int x = 0; x < Parts; ++x) {
-                const int sum = part[static_cast<std::size_t>(y * Parts + x)] * Parts * Parts + lost;
+                const int sum = *part++ * Parts * Parts + lost;
                 to[y][block * Parts + x] = static_cast<unsigned char>(std::clamp(sum / area, 0, 255));
             }
         }
