@@ -44,8 +44,7 @@ QString tlsAdvice(TlsFault fault) {
     switch (fault) {
     case TlsFault::WrongHost:
         return u"write the host as the certificate names it, or ask the lab for a certificate with this name; if "
-               u"neither "
-               "is wrong, somebody else answers in the lab's place"_s;
+               "neither is wrong, somebody else answers in the lab's place"_s;
     case TlsFault::Expired:
         return u"ask the lab for a new certificate; is this machine's clock right?"_s;
     case TlsFault::NotYetValid:
@@ -136,8 +135,7 @@ void StationCheck::checkLabFile(const HostPath& labFile) {
         tell(Fault, u"lab.ini"_s, error,
              !locked ? u"the program does not start before this line is right"_s
                      : u"try it as the user to whom the file belongs (sudo -u NAME lumora --check); if that is not the "
-                       u"one who "
-                       "runs the program: chown"_s);
+                       "one who runs the program: chown"_s);
     for (const QString& warning : m_lab.warnings)
         tell(Fault, u"lab.ini"_s, warning);
     if (m_lab.errors.isEmpty() && m_lab.warnings.isEmpty())

@@ -42,11 +42,13 @@ Result<Address> addressOf(const QString& url) {
     const bool encrypted = url.startsWith(u"https://"_s, Qt::CaseInsensitive);
     if (!encrypted && !url.startsWith(u"http://"_s, Qt::CaseInsensitive))
         return callFailure(Failure::Kind::Unsupported, url, u"only http and https addresses can be called"_s);
-    const QString rest = url.mid(encrypted ? 8 : 7);
+    Address address{.host = {}, .target = {}, .encrypted = encrypted};
+    const QString rest = url.mid(address.scheme().size());
     qsizetype hostEnd = 0;
     while (hostEnd < rest.size() && !u"/?#"_s.contains(rest[hostEnd]))
         ++hostEnd;
-    Address address{rest.left(hostEnd).toStdString(), HttpTarget(rest.mid(hostEnd)), encrypted};
+    address.host = rest.left(hostEnd).toStdString();
+    address.target = HttpTarget(rest.mid(hostEnd));
     if (address.host.empty())
         return callFailure(Failure::Kind::Unsupported, url, u"the address names no host"_s);
     return address;

@@ -13,6 +13,7 @@
 #include <chrono>
 #include <cstring>
 #include <new>
+#include <optional>
 
 namespace lumora {
 namespace {
@@ -47,8 +48,8 @@ TlsFault faultOfCertificate(long verdict) {
     }
 }
 
-// What was read in place of a handshake: words, or a protocol that is not taken.
-TlsFault faultOfHandshake(int reason) {
+// What was read in place of a handshake: words, or a protocol that is not taken; no value for a line that broke.
+std::optional<TlsFault> faultOfHandshake(int reason) {
     switch (reason) {
     case SSL_R_WRONG_VERSION_NUMBER:
     case SSL_R_HTTP_REQUEST:
@@ -56,19 +57,12 @@ TlsFault faultOfHandshake(int reason) {
     case SSL_R_PACKET_LENGTH_TOO_LONG:
     case SSL_R_UNEXPECTED_MESSAGE:
         return TlsFault::NotOffered;
-    default:
-        return TlsFault::TooOld;
-    }
-}
-
-bool isOfHandshake(int reason) {
-    switch (reason) {
     case SSL_R_UNSUPPORTED_PROTOCOL:
     case SSL_R_NO_PROTOCOLS_AVAILABLE:
     case SSL_R_TLSV1_ALERT_PROTOCOL_VERSION:
-        return true;
+        return TlsFault::TooOld;
     default:
-        return faultOfHandshake(reason) == TlsFault::NotOffered;
+        return std::nullopt;
     }
 }
 
@@ -185,8 +179,8 @@ private:
             const long verdict = SSL_get_verify_result(m_ssl);
             throw TlsRefused(faultOfCertificate(verdict), X509_verify_cert_error_string(verdict));
         }
-        if (!m_ready && isOfHandshake(reason))
-            throw TlsRefused(faultOfHandshake(reason), reasonOf(error));
+        if (const auto fault = faultOfHandshake(reason); fault && !m_ready)
+            throw TlsRefused(*fault, reasonOf(error));
         throw Poco::Net::NetException("encryption", reasonOf(error));
     }
 

@@ -26,9 +26,7 @@ constexpr qint64 largestFile = 1 << 20; // bytes
 bool printable(const LabKey& key, const QString& value) {
     const bool control = std::any_of(value.begin(), value.end(),
                                      [](QChar letter) { return letter.unicode() < 0x20 || letter.unicode() == 0x7F; });
-    // A path of this machine is never written in the code page.
-    return !control && (key.section == u"Drives" || key.section == u"Texts" || key.name == u"Ca" ||
-                        AnsiCodePage::squeeze(value) == value);
+    return !control && (key.ofMachine || AnsiCodePage::squeeze(value) == value);
 }
 
 // Sets the value in the deployment. Returns what is wrong with the value, or an empty text. No message repeats a

@@ -52,6 +52,7 @@ auto at(T MailAccount::*field) {
 struct Kind {
     QString allowed;
     std::function<bool(D&, const QString&)> set;
+    bool ofMachine = false;
 };
 
 bool matches(const QString& value, const QString& pattern) {
@@ -73,9 +74,12 @@ Kind shortText(Where where) {
     return text(where, u"up to 80 characters"_s, u"(?s).{0,80}"_s);
 }
 
+// what: "file" or "folder".
 template <class Where>
-Kind file(Where where) {
-    return text(where, u"the whole path of a file, beginning with /, or empty"_s, u"(?s)(/.*)?"_s);
+Kind pathOf(const QString& what, Where where) {
+    Kind kind = text(where, u"the whole path of a %1, beginning with /, or empty"_s.arg(what), u"(?s)(/.*)?"_s);
+    kind.ofMachine = true;
+    return kind;
 }
 
 template <class Where>
@@ -204,7 +208,7 @@ std::vector<Row> rows() {
          words<FtpTls>(
              at(&LineEncryption::ftp), u"none, explicit or implicit"_s,
              {{u"none"_s, FtpTls::None}, {u"explicit"_s, FtpTls::Explicit}, {u"implicit"_s, FtpTls::Implicit}})},
-        {"Server", "Ca", file(at(&LineEncryption::authorities))},
+        {"Server", "Ca", pathOf(u"file"_s, at(&LineEncryption::authorities))},
         {"Server", "Session",
          words<bool>(at(&D::keptFtpSession), u"each or kept"_s, {{u"each"_s, false}, {u"kept"_s, true}})},
         {"Server", "Lines", number(at(&D::ftpLines), 1, 4)},
@@ -262,9 +266,9 @@ std::vector<Row> rows() {
         {"Switches", "QuickOrder", yesNo<I>(at(&D::MinuyPaar), 1, 2)},
         {"Switches", "SplitPage", yesNo(at(&D::SplitPage), true, false)},
 
-        {"Texts", "Terms", file(at(&LabTexts::terms))},
-        {"Texts", "PriceList", file(at(&LabTexts::priceList))},
-        {"Texts", "Help", file(at(&LabTexts::help))},
+        {"Texts", "Terms", pathOf(u"file"_s, at(&LabTexts::terms))},
+        {"Texts", "PriceList", pathOf(u"file"_s, at(&LabTexts::priceList))},
+        {"Texts", "Help", pathOf(u"file"_s, at(&LabTexts::help))},
 
         {"Guards", "Careful", yesNo(at(&D::Careful), true, false)},
 
@@ -301,8 +305,7 @@ std::vector<Row> rows() {
         {"Log", "Keep", yesNo(at(&D::KeepLog), true, false)},
 
         {"Drives", "ProgramLetter", {u"one letter from A to Y"_s, setProgramLetter}},
-        {"Drives", "DataFolder",
-         text(at(&D::dataFolder), u"the whole path of a folder, beginning with /, or empty"_s, u"(?s)(/.*)?"_s)},
+        {"Drives", "DataFolder", pathOf(u"folder"_s, at(&D::dataFolder))},
         {"Drives", "Order", {u"letters from A to Z, each once, or empty"_s, setDriveOrder}},
 
         {"Mail", "Server",
@@ -357,8 +360,8 @@ const std::vector<LabKey>& labKeys() {
     static const std::vector<LabKey> keys = [] {
         std::vector<LabKey> made;
         for (const Row& row : rows())
-            made.push_back(
-                {QLatin1StringView(row.section), QLatin1StringView(row.name), row.kind.allowed, row.kind.set});
+            made.push_back({QLatin1StringView(row.section), QLatin1StringView(row.name), row.kind.allowed, row.kind.set,
+                            row.kind.ofMachine});
         addPlaces(made);
         return made;
     }();

@@ -14,6 +14,7 @@ struct LabKey {
     QString allowed; // the values that the key takes, in the words of a message
     // Returns false for a value that is not allowed; the deployment is unchanged then.
     std::function<bool(Deployment&, const QString&)> set;
+    bool ofMachine = false; // a path of this machine, which is never written in the lab's code page
 };
 
 // All keys, section by section. packaging/lab.ini.example explains each.

@@ -63,6 +63,11 @@ void Overlay::setFilling() {
     place();
 }
 
+void Overlay::dismiss() {
+    setOpen(false);
+    deleteLater();
+}
+
 void Overlay::setOpen(bool open) {
     if (m_open == open)
         return;

@@ -17,6 +17,8 @@ public:
 
     void setOpen(bool open);
     bool isOpen() const { return m_open; }
+    // Closes it for good.
+    void dismiss();
     // How much of the card's width is unfolded, from 0 to 1. The rest of the card neither shows nor answers.
     void setReveal(double share);
     QVBoxLayout* column() const { return m_column; }

@@ -11,6 +11,8 @@
 #include <QApplication>
 #include <QMouseEvent>
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -40,11 +42,8 @@ KioskPanels::KioskPanels(MainWindow& window, SessionState& state, PageChain& cha
 
 void KioskPanels::showQuestion() {
     if (!m_idle.asks()) {
-        if (m_question) {
-            m_question->setOpen(false);
-            m_question->deleteLater();
-            m_question = nullptr;
-        }
+        if (m_question)
+            std::exchange(m_question, nullptr)->dismiss();
         return;
     }
     closeDoor();
@@ -99,11 +98,8 @@ void KioskPanels::askForCode() {
 }
 
 void KioskPanels::closeDoor() {
-    if (!m_door)
-        return;
-    m_door->setOpen(false);
-    m_door->deleteLater();
-    m_door = nullptr;
+    if (m_door)
+        std::exchange(m_door, nullptr)->dismiss();
 }
 
 void KioskPanels::letStaffIn() {

@@ -10,6 +10,8 @@
 #include <QFile>
 #include <QStringDecoder>
 
+#include <utility>
+
 namespace lumora {
 
 using namespace Qt::StringLiterals;
@@ -18,7 +20,7 @@ namespace {
 
 constexpr qint64 largestText = 4 << 20; // bytes
 
-}
+} // namespace
 
 ScreenDialogs::ScreenDialogs(MainWindow& window, const SessionState& state, const Platform& platform)
     : m_window(window)
@@ -44,8 +46,7 @@ void ScreenDialogs::showNext() {
     connect(m_panel, &MessagePanel::answered, this, [this, panel = m_panel] {
         if (m_panel != panel)
             return;
-        panel->setOpen(false);
-        panel->deleteLater();
+        panel->dismiss();
         m_panel = nullptr;
         m_waiting.removeFirst();
         showNext();
@@ -63,11 +64,8 @@ QString ScreenDialogs::frontText() const {
 
 void ScreenDialogs::closeMessages() {
     m_waiting.clear();
-    if (m_panel) {
-        m_panel->setOpen(false);
-        m_panel->deleteLater();
-        m_panel = nullptr;
-    }
+    if (m_panel)
+        std::exchange(m_panel, nullptr)->dismiss();
 }
 
 Result<void> ScreenDialogs::showText(const HostPath& file, const QString& title) {
@@ -88,11 +86,8 @@ Result<void> ScreenDialogs::showText(const HostPath& file, const QString& title)
 }
 
 void ScreenDialogs::closeText() {
-    if (!m_text)
-        return;
-    m_text->setOpen(false);
-    m_text->deleteLater();
-    m_text = nullptr;
+    if (m_text)
+        std::exchange(m_text, nullptr)->dismiss();
 }
 
 void ScreenDialogs::closeAll() {

@@ -18,7 +18,6 @@ public:
         setOpenLinks(false);
         setFrameShape(QFrame::NoFrame);
         setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-        setUndoRedoEnabled(false);
         connect(this, &QTextBrowser::anchorClicked, this, [this](const QUrl& link) {
             if (link.hasFragment() && link.adjusted(QUrl::RemoveFragment).isEmpty())
                 scrollToAnchor(link.fragment());
@@ -59,11 +58,9 @@ TextPanel::TextPanel(const Theme& theme, QWidget* parent, const QString& title, 
     auto* text = new TextView(this, folder);
     text->setObjectName(u"labText"_s);
     text->setAccessibleName(title);
-    setRole(text, "text");
     // What leads nowhere does not look as if it led somewhere.
     text->document()->setDefaultStyleSheet(u"a { color: %1; text-decoration: none }"_s.arg(Theme::Colour::Ink.name()));
     text->setHtml(html);
-    text->moveCursor(QTextCursor::Start);
     QPushButton* close = plainButton(u"textClose"_s, "main", [this] { Q_EMIT closed(); });
     close->setText(closing);
     close->setAccessibleName(closing);
