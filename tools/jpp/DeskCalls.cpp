@@ -166,9 +166,12 @@ int DeskCalls::report(const QString& folder) const {
     const Result<DeskReport> report = DeskReport::of(**book, from, to);
     if (!report)
         return tell(faultFound, report.failure().message);
-    const QString base = QDir(m_parser.value(u"into"_s).isEmpty() ? u"."_s : m_parser.value(u"into"_s))
-                             .filePath(u"report-%1-%2"_s.arg(from.toString(Qt::ISODate), to.toString(Qt::ISODate)));
-    QDir().mkpath(QFileInfo(base).path()); // one that can't be made is told by the file in it
+    const QString into = m_parser.value(u"into"_s).isEmpty() ? u"."_s : m_parser.value(u"into"_s);
+    std::error_code error;
+    if (std::filesystem::create_directories(toHostPath(into), error); error)
+        return tell(faultFound, fileFailure(toHostPath(into), u"the folder can't be made"_s, error.value()).message);
+    const QString base =
+        QDir(into).filePath(u"report-%1-%2"_s.arg(from.toString(Qt::ISODate), to.toString(Qt::ISODate)));
     for (const auto& [ending, bytes] : {std::pair(u".csv"_s, report->csv()), {u".html"_s, report->html()}}) {
         if (const auto written = writeWholeFile(toHostPath(base + ending), bytes); !written)
             return tell(faultFound, written.failure().message);
