@@ -1,5 +1,7 @@
 #pragma once
 
+#include "common/TlsFault.h"
+
 #include <QString>
 
 #include <cassert>
@@ -28,7 +30,8 @@ struct Failure {
     };
     Kind kind = Kind::Other;
     QString message;
-    bool passing = false; // the other side has said that it may answer otherwise later
+    bool passing = false;             // the other side has said that it may answer otherwise later
+    std::optional<TlsFault> tls = {}; // why a line that was to be encrypted was refused
 };
 
 // A value or the failure that stands in its place.

@@ -31,8 +31,6 @@ using enum CheckLine::State;
 constexpr qint64 littleSpace = 5'000'000'000;
 constexpr qint64 noSpace = 500'000'000;
 
-constexpr quint16 httpPort = 80;
-
 QString gigabytes(qint64 bytes) {
     return u"%1 GB"_s.arg(static_cast<double>(bytes) / 1e9, 0, 'f', 1);
 }
@@ -67,8 +65,8 @@ QString tlsAdvice(TlsFault fault) {
 }
 
 QString connectAdvice(const Failure& failure) {
-    if (const auto fault = tlsFaultOf(failure))
-        return tlsAdvice(*fault);
+    if (failure.tls)
+        return tlsAdvice(*failure.tls);
     switch (failure.kind) {
     case Failure::Kind::Unsupported:
         return u"set [Server] Tls = explicit, or implicit where the lab says so"_s;
@@ -249,17 +247,16 @@ void StationCheck::checkHosts() {
     struct Host {
         const char* key;
         QString address;
-        quint16 port;
+        quint16 port = 0; // of an address without a scheme
     };
     QList<Host> hosts;
     const bool byHttp = m_lab.deployment.SugSheliach == Sender::Http;
     if (lab.ReportOn > 0) {
-        hosts += {"[Addresses] Report", lab.ReportUrl, httpPort};
-        hosts += byHttp ? Host{"[Addresses] HttpDone", lab.HttpDoneUrl, httpPort}
-                        : Host{"[Addresses] Done", lab.DoneUrl, httpPort};
+        hosts += {"[Addresses] Report", lab.ReportUrl};
+        hosts += byHttp ? Host{"[Addresses] HttpDone", lab.HttpDoneUrl} : Host{"[Addresses] Done", lab.DoneUrl};
     }
     if (byHttp)
-        hosts += {"[Addresses] HttpHost", lab.HttpHost, httpPort};
+        hosts += {"[Addresses] HttpHost", lab.HttpHost};
     if (lab.mail.setUp())
         hosts += {"[Mail] Server", lab.mail.host, SmtpPort(lab.mail)};
     for (const Host& host : hosts) {
@@ -269,9 +266,9 @@ void StationCheck::checkHosts() {
             tell(Good, key, u"answers at its port"_s);
             continue;
         }
-        const auto fault = tlsFaultOf(reached.failure());
         tell(Fault, key, reached.failure().message,
-             fault ? tlsAdvice(*fault) : u"is this machine on line, and is the address right?"_s);
+             reached.failure().tls ? tlsAdvice(*reached.failure().tls)
+                                   : u"is this machine on line, and is the address right?"_s);
     }
 }
 

@@ -4,8 +4,6 @@
 
 #include <QString>
 
-#include <optional>
-
 namespace lumora {
 
 // How the line to the FTP server is encrypted: not at all, behind AUTH TLS, or from its first byte on.
@@ -18,24 +16,8 @@ struct LineEncryption {
     bool operator==(const LineEncryption&) const = default;
 };
 
-// Why nothing was sent over a line that was to be encrypted.
-enum class TlsFault {
-    WrongHost,
-    Expired,
-    NotYetValid,
-    SelfSigned,
-    UnknownAuthority,
-    NotTrusted,       // for another reason
-    NoAuthorities,    // the file of authorities can't be read
-    NotOffered,       // the server speaks in plain text alone
-    TooOld,           // below TLS 1.2
-    DataNotEncrypted, // PROT P is refused
-};
-
 // The words for whoever looks after the machine.
 QString tlsWords(TlsFault fault);
 Failure tlsFailure(TlsFault fault, const QString& host, const QString& detail);
-// The fault that a failure of the line was made from.
-std::optional<TlsFault> tlsFaultOf(const Failure& failure);
 
 } // namespace lumora

@@ -11,8 +11,6 @@ namespace lumora {
 
 using namespace Qt::StringLiterals;
 
-constexpr quint16 httpsPort = 443;
-
 Result<void> ReachHost(const QString& host, quint16 usualPort, const LineEncryption& encryption,
                        const TimeLimits& limits) {
     const QString asked = host.contains(u"://"_s) ? QUrl(host).authority() : host;
@@ -22,9 +20,11 @@ Result<void> ReachHost(const QString& host, quint16 usualPort, const LineEncrypt
     LineAbort line;
     const LineCall call(limits, line, std::make_shared<TlsTrust>(encryption.authorities));
     const bool encrypted = host.startsWith(u"https://"_s, Qt::CaseInsensitive);
+    const bool plain = host.startsWith(u"http://"_s, Qt::CaseInsensitive);
     const WithoutBrokenPipeSignal guard;
     try {
-        LineSocket socket(ResolvedAddress(asked.toStdString(), encrypted ? httpsPort : usualPort, call), call);
+        const quint16 port = encrypted ? httpsPort : plain ? httpPort : usualPort;
+        LineSocket socket(ResolvedAddress(asked.toStdString(), port, call), call);
         if (encrypted)
             socket.encrypt(asked.toStdString(), call);
         socket.close();

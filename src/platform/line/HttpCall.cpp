@@ -35,7 +35,7 @@ struct Address {
     bool encrypted = false;
 
     QString scheme() const { return encrypted ? u"https://"_s : u"http://"_s; }
-    Poco::UInt16 usualPort() const { return encrypted ? 443 : 80; }
+    Poco::UInt16 usualPort() const { return encrypted ? httpsPort : httpPort; }
 };
 
 Result<Address> addressOf(const QString& url) {

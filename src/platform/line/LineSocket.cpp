@@ -23,7 +23,7 @@ struct NameAnswer {
     std::mutex mutex;
     std::condition_variable told;
     std::optional<SocketAddress> address;
-    std::string failure;
+    std::exception_ptr failure;
     bool done = false;
 };
 
@@ -58,13 +58,11 @@ SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, c
     const auto answer = std::make_shared<NameAnswer>();
     runInBackground([answer, name, port] {
         std::optional<SocketAddress> address;
-        std::string failure;
+        std::exception_ptr failure;
         try {
             address = SocketAddress(name, port);
-        } catch (const Poco::Exception& exception) {
-            failure = exception.displayText();
-        } catch (const std::exception& exception) {
-            failure = exception.what();
+        } catch (...) {
+            failure = std::current_exception();
         }
         const std::lock_guard lock(answer->mutex);
         answer->address = address;
@@ -81,7 +79,7 @@ SocketAddress ResolvedAddress(const std::string& host, Poco::UInt16 usualPort, c
             throw Poco::TimeoutException();
     }
     if (!answer->address)
-        throw Poco::Net::HostNotFoundException(answer->failure);
+        std::rethrow_exception(answer->failure);
     return *answer->address;
 }
 

@@ -13,6 +13,9 @@
 
 namespace lumora {
 
+constexpr Poco::UInt16 httpPort = 80;
+constexpr Poco::UInt16 httpsPort = 443;
+
 // What a dialogue needs of the line it goes over: its time limits, and whether it has been cut meanwhile.
 class LineCall {
 public:

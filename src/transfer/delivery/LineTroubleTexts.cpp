@@ -53,8 +53,8 @@ QString LineTroubleText(const SessionState& state, LineStep step, const Failure&
     const bool answered = failure.kind == Failure::Kind::Refused || failure.kind == Failure::Kind::AccessDenied;
     // Isolating marks: the name may run in the other direction than the sentence.
     const QString name = QChar(0x2068) + subject + QChar(0x2069);
-    if (const auto fault = tlsFaultOf(failure))
-        return encryptionTrouble(state, *fault);
+    if (failure.tls)
+        return encryptionTrouble(state, *failure.tls);
     switch (step) {
     case LineStep::Open:
         return state.wording(u"למחשב אין קשר לאינטרנט. יש לבדוק את החיבור ולנסות שוב."_s,

@@ -197,17 +197,17 @@ TEST_F(TlsTest, AServerThatCanNotBeTrustedHearsNoPassword) {
         begin(one.manner);
         const auto refused = connect(FtpTls::Explicit, one.authorities);
         ASSERT_FALSE(refused);
-        EXPECT_EQ(tlsFaultOf(refused.failure()), one.fault) << refused.failure().message.toStdString();
+        EXPECT_EQ(refused.failure().tls, one.fault) << refused.failure().message.toStdString();
         server.reset();
         EXPECT_TRUE(inPlainText == "AUTH " || inPlainText == "AUTH QUIT ") << inPlainText.toStdString();
     }
     begin({});
-    EXPECT_EQ(tlsFaultOf(connect(FtpTls::Implicit).failure()), TlsFault::NotOffered);
+    EXPECT_EQ(connect(FtpTls::Implicit).failure().tls, TlsFault::NotOffered);
     const auto web = [&] { return u"https://127.0.0.1:%1"_s.arg(server->port()); };
-    EXPECT_EQ(tlsFaultOf(internet->fetch(web()).failure()), TlsFault::NotOffered);
+    EXPECT_EQ(internet->fetch(web()).failure().tls, TlsFault::NotOffered);
     begin({.certificate = "wrong", .implicit = true});
-    EXPECT_EQ(tlsFaultOf(internet->fetch(web()).failure()), TlsFault::WrongHost);
-    EXPECT_EQ(tlsFaultOf(ReachHost(web(), 80, {FtpTls::None, known}).failure()), TlsFault::WrongHost);
+    EXPECT_EQ(internet->fetch(web()).failure().tls, TlsFault::WrongHost);
+    EXPECT_EQ(ReachHost(web(), 80, {FtpTls::None, known}).failure().tls, TlsFault::WrongHost);
     begin({.implicit = true});
     EXPECT_TRUE(ReachHost(web(), 80, {FtpTls::None, known}));
 }
