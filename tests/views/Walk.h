@@ -28,6 +28,7 @@ struct Screen {
     QSize size;
     bool english;
     bool contrast = false; // [Look] Contrast of the lab's file
+    int letters = 0;       // of the desktop, in pixels
 };
 
 // Parts of a route, from the start page on.

@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFile>
+#include <QFontInfo>
 #include <QPainter>
 #include <QPalette>
 #include <QRegularExpression>
@@ -55,6 +56,10 @@ const struct {
 
 // Set by setLook(), as the colours are.
 Theme::Look shownLook = Theme::Look::Calm;
+int leastLetters = 0;
+
+constexpr int bodyText = 17; // at a factor of 1
+constexpr double largestGrowth = 1.0625;
 
 // A piece of a line without the signs of the sentence around it; told apart where it has more than words.
 QString apart(QString piece, bool behindLetter) {
@@ -130,8 +135,17 @@ QMargins Theme::margins(Pad pad) const {
 }
 
 int Theme::text(Type type) const {
-    static constexpr int pixels[] = {13, 14, 15, 16, 17, 17, 19, 20, 22, 27, 40, 52, 84};
-    return px(pixels[static_cast<int>(type)]);
+    static constexpr int pixels[] = {13, 14, 15, 16, bodyText, bodyText, 19, 20, 22, 27, 40, 52, 84};
+    return px(pixels[static_cast<int>(type)] * growth());
+}
+
+double Theme::growth() const {
+    return std::clamp(leastLetters / (bodyText * factor()), 1.0, largestGrowth);
+}
+
+int Theme::side(double length) const {
+    // What larger letters take comes from the room beside them, so that a bar of buttons stays as wide as it is.
+    return px(length * (1 - 6 * (growth() - 1)));
 }
 
 int Theme::edge() const {
@@ -186,6 +200,11 @@ QString Theme::styleSheet() const {
                                        {u"least", least()},
                                        {u"leastKey", least() - border},
                                        {u"row", target()},
+                                       {u"main", std::max(least(), px(58))},
+                                       {u"side", side(18)},
+                                       {u"sideMain", side(34)},
+                                       {u"sideSecondary", side(22)},
+                                       {u"sideQuiet", side(12)},
                                        {u"key", key() - border},
                                        {u"halfKey", key() / 2}})
         values[QString::fromUtf16(name)] = QString::number(pixels);
@@ -217,7 +236,7 @@ QString Theme::styleSheet() const {
         return {};
     const QString sheet = QString::fromUtf8(file.readAll());
     static const QRegularExpression placeholder(
-        u"@(\\d+)|\\$(target|tall|leastKey|least|row|halfKey|key|edge|mark|off|bareOff|bare|quiet|text[A-Z]\\w+|[A-Z]\\w+)"_s);
+        u"@(\\d+)|\\$(target|tall|leastKey|least|row|main|sideMain|sideSecondary|sideQuiet|side|halfKey|key|edge|mark|off|bareOff|bare|quiet|text[A-Z]\\w+|[A-Z]\\w+)"_s);
     QString result;
     qsizetype from = 0;
     for (auto it = placeholder.globalMatch(sheet); it.hasNext();) {
@@ -234,14 +253,19 @@ QString Theme::styleSheet() const {
 }
 
 void Theme::apply(QApplication& application) {
+    setLetters(QFontInfo(QApplication::font()).pixelSize());
     QApplication::setStyle(QStyleFactory::create(u"Fusion"_s));
     // What texts name "David" comes with the free Hebrew fonts under a name of its own.
     QFont::insertSubstitution(u"David"_s, u"David CLM"_s);
     QFont font;
     font.setFamilies({u"Noto Sans"_s, u"Noto Sans Hebrew"_s, u"DejaVu Sans"_s});
-    font.setPixelSize(17);
+    font.setPixelSize(bodyText);
     application.setFont(font);
     setLook(Look::Calm);
+}
+
+void Theme::setLetters(int pixels) {
+    leastLetters = pixels;
 }
 
 void Theme::setLook(Look look) {

@@ -64,6 +64,9 @@ public:
     };
     // To be called before a page is made: what is on the screen keeps the look that it has.
     static void setLook(Look look);
+    // The same for the desktop's letters, in pixels: no page's are smaller, up to a sixteenth more than its window
+    // gives.
+    static void setLetters(int pixels);
 
     struct Fit {
         double factor = 1;
@@ -105,6 +108,8 @@ public:
     // The sizes of text.
     enum class Type { Note, Small, Tall, Word, Body, Strong, Field, Large, Key, Title, Display, Number, Giant };
     int text(Type type) const;
+    // By how much the desktop's letters make ours larger than the factor does.
+    double growth() const;
     QFont font(Type type) const;
 
     // One of our own drawings (views/icons), in one colour.
@@ -113,11 +118,12 @@ public:
 
     QString styleSheet() const;
 
-    // Fonts, style and the calm look of the application.
+    // Fonts, style and the calm look of the application; the desktop's font as it stands before.
     static void apply(QApplication& application);
 
 private:
     static constexpr double smallest = 0.75; // of a window of 800 by 600
+    int side(double length) const;           // of a button, beside its words
     Fit m_fit;
     mutable std::map<std::pair<QString, std::pair<int, QRgb>>, QPixmap> m_icons;
 };

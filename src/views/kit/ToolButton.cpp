@@ -40,22 +40,32 @@ void ToolButton::setMarked(bool marked) {
 QFont ToolButton::words() const {
     QFont font = m_theme.font(Theme::Type::Small);
     font.setBold(false); // the painter would otherwise use the weight of a button
+    // A word that would be cut by the key does not grow with the desktop's letters.
+    int longest = 0;
+    for (const QString& word : said().split(u' '))
+        longest = std::max(longest, QFontMetrics(font).horizontalAdvance(word));
+    if (longest > m_theme.px(m_size.width() - 4))
+        font.setPixelSize(static_cast<int>(font.pixelSize() / m_theme.growth()));
     return font;
+}
+
+QString ToolButton::said() const {
+    QString words = text();
+    words.replace(u"&&"_s, u"&"_s);
+    return withoutIsolation(words);
 }
 
 // One line where it fits, else two, broken at the blank that leaves the longer one shortest.
 QStringList ToolButton::lines() const {
-    QString said = text();
-    said.replace(u"&&"_s, u"&"_s);
-    said = withoutIsolation(said);
+    const QString whole = said();
     const QFontMetrics metrics(words());
     const int room = m_theme.px(m_size.width()) - m_theme.px(6);
-    if (metrics.horizontalAdvance(said) <= room || !said.contains(u' '))
-        return {said};
+    if (metrics.horizontalAdvance(whole) <= room || !whole.contains(u' '))
+        return {whole};
     QStringList best;
     int least = 0;
-    for (qsizetype at = said.indexOf(u' '); at >= 0; at = said.indexOf(u' ', at + 1)) {
-        const QStringList two{said.left(at), said.mid(at + 1)};
+    for (qsizetype at = whole.indexOf(u' '); at >= 0; at = whole.indexOf(u' ', at + 1)) {
+        const QStringList two{whole.left(at), whole.mid(at + 1)};
         const int longer = std::max(metrics.horizontalAdvance(two[0]), metrics.horizontalAdvance(two[1]));
         if (best.isEmpty() || longer < least) {
             best = two;
@@ -89,9 +99,9 @@ void ToolButton::paintEvent(QPaintEvent*) {
     if (isDown()) // sunk
         painter.translate(0, m_theme.px(1));
 
-    const QStringList said = lines();
-    const double lineHeight = m_theme.px(16);
-    const double under = said.first().isEmpty() ? 0 : lineHeight * static_cast<double>(said.size());
+    const QStringList shown = lines();
+    const double lineHeight = m_theme.px(16 * m_theme.growth());
+    const double under = shown.first().isEmpty() ? 0 : lineHeight * static_cast<double>(shown.size());
     const double signHeight =
         std::min<double>(m_theme.px(m_picture.isNull() ? 26 : 40), height() - under - m_theme.px(6));
     const double gap = m_theme.px(2);
@@ -105,9 +115,9 @@ void ToolButton::paintEvent(QPaintEvent*) {
     painter.setFont(words());
     painter.setPen(isEnabled() ? Theme::Colour::Ink : Theme::Colour::Muted);
     painter.setLayoutDirection(layoutDirection());
-    for (qsizetype i = 0; i < said.size(); ++i)
+    for (qsizetype i = 0; i < shown.size(); ++i)
         painter.drawText(QRectF(0, top + signHeight + gap + lineHeight * static_cast<double>(i), width(), lineHeight),
-                         Qt::AlignCenter | Qt::TextDontClip, said[i]);
+                         Qt::AlignCenter | Qt::TextDontClip, shown[i]);
 }
 
 } // namespace lumora

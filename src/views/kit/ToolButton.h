@@ -27,6 +27,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
+    QString said() const;
     QFont words() const;
     QStringList lines() const;
 
