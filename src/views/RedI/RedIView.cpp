@@ -74,6 +74,7 @@ QWidget* RedIView::makeSide() {
     if (theme().isTall())
         return inBox(inRow(Space::Normal, {{m_overview, 0, Qt::AlignVCenter}, {card.frame, 1}, pad}));
     QWidget* side = inBox(inColumn(Space::Small, {{m_overview, 0, Qt::AlignHCenter}, {card.frame, 1}, pad}));
+    // Larger letters break the guide into more lines, and the card can't become higher.
     side->setFixedWidth(theme().px(276 * theme().growth() * theme().growth()));
     return side;
 }

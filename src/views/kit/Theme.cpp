@@ -56,10 +56,10 @@ const struct {
 
 // Set by setLook(), as the colours are.
 Theme::Look shownLook = Theme::Look::Calm;
-int leastLetters = 0;
+int leastLetters = 0; // set by setLetters()
 
-constexpr int bodyText = 17; // at a factor of 1
-constexpr double largestGrowth = 1.0625;
+constexpr int bodyText = 17;             // at a factor of 1
+constexpr double largestGrowth = 1.0625; // what the smallest pages have room for
 
 // A piece of a line without the signs of the sentence around it; told apart where it has more than words.
 QString apart(QString piece, bool behindLetter) {
@@ -144,7 +144,8 @@ double Theme::growth() const {
 }
 
 int Theme::side(double length) const {
-    // What larger letters take comes from the room beside them, so that a bar of buttons stays as wide as it is.
+    // What larger letters take comes from the room beside them, so that a bar of buttons stays as wide as it is; six
+    // times the growth is what the fullest one needs.
     return px(length * (1 - 6 * (growth() - 1)));
 }
 
