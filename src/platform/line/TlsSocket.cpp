@@ -77,7 +77,8 @@ public:
         if (Poco::Net::IPAddress::tryParse(host, address)) {
             X509_VERIFY_PARAM_set1_ip_asc(SSL_get0_param(m_ssl), host.c_str());
         } else {
-            SSL_set_hostflags(m_ssl, X509_CHECK_FLAG_NO_PARTIAL_WILDCARDS);
+            // RFC 9525, section 6.3: the common name says nothing.
+            SSL_set_hostflags(m_ssl, X509_CHECK_FLAG_NO_PARTIAL_WILDCARDS | X509_CHECK_FLAG_NEVER_CHECK_SUBJECT);
             SSL_set1_host(m_ssl, host.c_str());
             SSL_set_tlsext_host_name(m_ssl, host.c_str());
         }

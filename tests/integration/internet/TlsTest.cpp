@@ -22,14 +22,17 @@ using Poco::Net::SecureStreamSocket;
 using Poco::Net::StreamSocket;
 using DataChannel = Internet::DataChannel;
 
-// An authority, and certificates by it: good, wrong (for another host), old (expired); one that is signed by itself.
+// An authority, and certificates by it: good, wrong (for another host), old (expired), named (for a host without
+// alternative names); one that is signed by itself.
 constexpr const char* makeCertificates = R"(set -e; cd "$1"
 openssl req -x509 -newkey ec -pkeyopt ec_paramgen_curve:prime256v1 -nodes -days 2 -subj /CN=lab -keyout key -out authority
 openssl req -x509 -key key -days 2 -subj /CN=alone -addext subjectAltName=IP:127.0.0.1 -out alone
 while read -r name days host; do
   openssl req -new -key key -subj /CN=lab.example -addext "subjectAltName=$host" -out request
   openssl x509 -req -in request -CA authority -CAkey key -CAcreateserial -days "$days" -copy_extensions copy -out "$name"
-done <<<$'good 2 IP:127.0.0.1\nwrong 2 DNS:other.example\nold -1 IP:127.0.0.1')";
+done <<<$'good 2 IP:127.0.0.1\nwrong 2 DNS:other.example\nold -1 IP:127.0.0.1'
+openssl req -new -key key -subj /CN=localhost -out request
+openssl x509 -req -in request -CA authority -CAkey key -CAcreateserial -days 2 -out named)";
 
 const QString& certificates() {
     static const QTemporaryDir folder;
@@ -127,10 +130,11 @@ protected:
     }
 
     Result<std::unique_ptr<FtpConnection>> connect(FtpTls way,
-                                                   const QString& authorities = certificates() + u"authority"_s) {
+                                                   const QString& authorities = certificates() + u"authority"_s,
+                                                   const QString& host = u"127.0.0.1"_s) {
         internet.emplace(TimeLimits{Poco::Timespan(30, 0), Poco::Timespan(3, 0)}, FtpType::Image,
                          LineEncryption{way, authorities});
-        return internet->connectFtp(u"127.0.0.1:%1"_s.arg(server->port()), u"ftp"_s, u"secret"_s, DataChannel::Passive);
+        return internet->connectFtp(host + u":%1"_s.arg(server->port()), u"ftp"_s, u"secret"_s, DataChannel::Passive);
     }
 
     // A server of this manner, behind the end of the one before.
@@ -181,8 +185,10 @@ TEST_F(TlsTest, AServerThatCanNotBeTrustedHearsNoPassword) {
         Manner manner;
         QString authorities;
         TlsFault fault;
+        QString host = u"127.0.0.1"_s;
     } cases[] = {
         {"another host", {.certificate = "wrong"}, known, TlsFault::WrongHost},
+        {"a common name alone", {.certificate = "named"}, known, TlsFault::WrongHost, u"localhost"_s},
         {"expired", {.certificate = "old"}, known, TlsFault::Expired},
         {"signed by itself", {.certificate = "alone"}, known, TlsFault::SelfSigned},
         {"unknown authority", {}, {}, TlsFault::UnknownAuthority},
@@ -195,7 +201,7 @@ TEST_F(TlsTest, AServerThatCanNotBeTrustedHearsNoPassword) {
     for (const auto& one : cases) {
         SCOPED_TRACE(one.name);
         begin(one.manner);
-        const auto refused = connect(FtpTls::Explicit, one.authorities);
+        const auto refused = connect(FtpTls::Explicit, one.authorities, one.host);
         ASSERT_FALSE(refused);
         EXPECT_EQ(refused.failure().tls, one.fault) << refused.failure().message.toStdString();
         server.reset();
