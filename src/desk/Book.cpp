@@ -390,15 +390,17 @@ Result<Book::Period> Book::period(qint64 from, qint64 before) {
     while (rows->next())
         period.prints += {rows->value(0).toString(), rows->value(1).toString(), rows->value(2).toString(),
                           rows->value(3).toInt(), rows->value(4).toInt()};
-    rows = run(u"SELECT f.name, f.at, f.words, o.state FROM desk_faults f JOIN desk_orders o ON o.name = f.name WHERE "
+    rows = run(u"SELECT f.name, f.at, f.words, o.state, o.words FROM desk_faults f JOIN desk_orders o ON o.name = "
+               u"f.name WHERE "
                u"f.at >= ? AND f.at < ? ORDER BY f.at, f.name"_s,
                ends);
     if (!rows)
         return rows.failure();
     while (rows->next()) {
         const QString state = rows->value(3).toString();
-        period.faults += {rows->value(0).toString(), rows->value(1).toLongLong(), rows->value(2).toString(),
-                          state == wordOf(State::Ready) || state == wordOf(State::Placed)};
+        period.faults +=
+            {rows->value(0).toString(), rows->value(1).toLongLong(), rows->value(2).toString(),
+             state == wordOf(State::Placed) || (state == wordOf(State::Ready) && rows->value(4).toString().isEmpty())};
     }
     return period;
 }

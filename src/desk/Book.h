@@ -34,7 +34,7 @@ struct DeskOrder {
     QString name;
     State state = State::Waiting;
     QString trace; // of its folder when it was last looked at
-    QString words;
+    QString words; // what is missing, or why it was put off; empty once that is mended
     QString desk, room;
     int tries = 0;      // how often it was begun
     int prints = 0;     // print files
@@ -86,7 +86,7 @@ public:
         QString name;
         qint64 at = 0;
         QString words;
-        bool mended = false; // the order was placed since
+        bool mended = false; // nothing of the order is at fault any more
     };
     struct Period {
         QList<DeskOrder> orders;

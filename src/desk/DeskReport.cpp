@@ -175,7 +175,7 @@ QByteArray DeskReport::html() const {
     text += u"</table>\n<h2>Faults</h2>\n"_s;
     if (m_period.faults.isEmpty())
         return (text + u"<p>None.</p>\n</body></html>\n"_s).toUtf8();
-    text += u"<table><tr><th>Told</th><th>Order</th><th>What was missing</th><th></th></tr>\n"_s;
+    text += u"<table><tr><th>Told</th><th>Order</th><th>What was wrong</th><th></th></tr>\n"_s;
     for (const Book::Fault& fault : m_period.faults)
         text += row({timeText(fault.at, u"yyyy-MM-dd HH:mm"_s), fault.name, fault.words,
                      fault.mended ? u"mended"_s : u"open"_s});

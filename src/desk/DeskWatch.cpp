@@ -48,6 +48,32 @@ void count(DeskOrder& order, const QList<DeskOrder::Prints>& prints, const Arriv
     order.failed = arrived.findings.failed;
 }
 
+struct ExportRoom {
+    QString room;
+    Descriptor lock;
+    bool goesOn; // it is ready: an earlier export was cut off behind that, and only the rest moves
+};
+
+Result<ExportRoom> takeExportRoom(const HotFolder& hotFolder, const QString& key) {
+    for (const QString& left : hotFolder.rooms()) {
+        if (HotFolder::keyOf(left) != key)
+            continue;
+        Result<Descriptor> lock = hotFolder.hold(left);
+        if (!lock)
+            return lock.failure();
+        if (hotFolder.isReady(left))
+            return ExportRoom{left, std::move(*lock), true};
+        hotFolder.clear(left);
+    }
+    const Result<QString> room = hotFolder.makeRoom(key);
+    if (!room)
+        return room.failure();
+    Result<Descriptor> lock = hotFolder.hold(*room);
+    if (!lock)
+        return lock.failure();
+    return ExportRoom{*room, std::move(*lock), false};
+}
+
 } // namespace
 
 Result<void> DeskWatch::begin() {
@@ -65,7 +91,11 @@ Result<void> DeskWatch::begin() {
     }
     for (const QString& room : rooms) {
         const QString key = HotFolder::keyOf(room);
-        if (ended.contains(key) || (key.endsWith(byHand) && m_hotFolder.isOld(room)))
+        const bool isExport = key.endsWith(byHand);
+        if (isExport && m_hotFolder.isReady(room) && m_hotFolder.hold(room))
+            m_tell(Tone::Fault, u"%1: its export was cut off; repeat it, and what is still missing comes out"_s.arg(
+                                    key.chopped(byHand.size())));
+        else if (ended.contains(key) || (isExport && !m_hotFolder.isReady(room) && m_hotFolder.isOld(room)))
             m_hotFolder.clear(room);
     }
     return {};
@@ -151,7 +181,9 @@ qint64 DeskWatch::shortPause() const {
 }
 
 Result<bool> DeskWatch::putOff(DeskOrder order, const QString& why) {
-    const Result<bool> saved = save(order, pause(order));
+    const bool news = order.words != why;
+    order.words = why;
+    const Result<bool> saved = save(order, pause(order), {{}, news ? why : QString()});
     if (saved && *saved)
         m_tell(Tone::Fault, u"%1: put off: %2"_s.arg(order.name, why));
     return saved;
@@ -254,6 +286,7 @@ Result<bool> DeskWatch::place(DeskOrder order) {
     if (const auto added = m_hotFolder.addLine(listOf(order), listHead, lineOf(order)); !added)
         return putOff(order, added.failure().message);
     order.state = State::Placed;
+    order.words.clear();
     const Result<bool> saved = save(order, 0);
     if (saved && *saved) {
         m_hotFolder.clear(order.room);
@@ -284,12 +317,13 @@ Result<DeskOrder> exportOrder(const fs::path& folder, const HotFolder& hotFolder
                               PrintFileShape shape) {
     std::error_code error;
     const QString key = toText(fs::weakly_canonical(folder, error).filename()) + byHand;
-    const Result<QString> room = hotFolder.makeRoom(key);
-    if (!room)
-        return room.failure();
+    const Result<ExportRoom> taken = takeExportRoom(hotFolder, key);
+    if (!taken)
+        return taken.failure();
+    const QString& room = taken->room;
     DeskOrder order;
     const auto work = [&]() -> Result<void> {
-        const Result<ArrivedOrder> arrived = ArrivedOrder::judge(folder, shape, hotFolder.pathOf(*room));
+        const Result<ArrivedOrder> arrived = ArrivedOrder::judge(folder, shape, hotFolder.pathOf(room));
         if (!arrived)
             return arrived.failure();
         if (!arrived->missing.isEmpty())
@@ -297,17 +331,24 @@ Result<DeskOrder> exportOrder(const fs::path& folder, const HotFolder& hotFolder
         order.name = arrived->name;
         order.ready = QDateTime::currentMSecsSinceEpoch();
         count(order, printsOf(*arrived), *arrived);
-        if (const auto made = hotFolder.makeReady(*room, *arrived, layout, shape); !made)
-            return made;
-        if (const auto placed = hotFolder.place(*room); !placed)
+        if (!taken->goesOn) {
+            if (const auto made = hotFolder.makeReady(room, *arrived, layout, shape); !made)
+                return made;
+        }
+        if (const auto placed = hotFolder.place(room); !placed)
             return placed;
         return hotFolder.addLine(DeskWatch::listOf(order), DeskWatch::listHead, DeskWatch::lineOf(order));
     };
     const Result<void> done = work();
-    hotFolder.clear(*room);
-    if (!done)
-        return done.failure();
-    return order;
+    const bool keeps = !done && hotFolder.isReady(room);
+    if (!keeps)
+        hotFolder.clear(room);
+    if (done)
+        return order;
+    Failure failure = done.failure();
+    if (keeps)
+        failure.message += u"; repeat the export once that is mended: it goes on from there"_s;
+    return failure;
 }
 
 } // namespace lumora

@@ -67,6 +67,7 @@ private:
 };
 
 // Judges one order and places it at once, as a lab does by hand; no book is asked. The failure tells what is missing.
+// What was cut off goes on with the next call: what has moved to its place is not placed again.
 Result<DeskOrder> exportOrder(const std::filesystem::path& folder, const HotFolder& hotFolder,
                               const PrintLayout& layout, PrintFileShape shape);
 

@@ -24,7 +24,9 @@ namespace fs = std::filesystem;
 namespace {
 
 const fs::path hidden = ".desk";
-const fs::path outward = "out"; // below a room, what goes to its place
+// Below a room: what is written, and, once all of it is, what goes to its place.
+const fs::path draft = "draft";
+const fs::path outward = "out";
 
 QString newId() {
     return QString::number(QRandomGenerator::system()->generate64(), 16).rightJustified(16, u'0');
@@ -90,12 +92,12 @@ Result<HotFolder> HotFolder::open(const fs::path& given) {
     const fs::path idFile = folder / hidden / "id";
     if (!fs::exists(idFile, error)) {
         const QString own = newId();
-        const fs::path draft = folder / hidden / ("id-" + own.toStdString());
-        if (const auto written = writeWholeFile(draft, own.toLatin1()); !written)
+        const fs::path ownFile = folder / hidden / ("id-" + own.toStdString());
+        if (const auto written = writeWholeFile(ownFile, own.toLatin1()); !written)
             return written.failure();
-        const int failed = moveToNewName(draft, idFile);
+        const int failed = moveToNewName(ownFile, idFile);
         if (failed == EEXIST)
-            fs::remove(draft, error);
+            fs::remove(ownFile, error);
         else if (failed != 0)
             return fileFailure(idFile, u"can't be written"_s, failed);
     }
@@ -145,19 +147,38 @@ Result<QString> HotFolder::makeRoom(const QString& key) const {
     if (const auto same = checkId(); !same)
         return same.failure();
     const QString room = key + u'~' + newId();
-    if (const auto made = makeFolders(pathOf(room) / outward); !made)
+    if (const auto made = makeFolders(pathOf(room) / draft); !made)
         return made.failure();
     return room;
 }
 
+bool HotFolder::isReady(const QString& room) const {
+    std::error_code error;
+    return fs::is_directory(pathOf(room) / outward, error);
+}
+
+Result<Descriptor> HotFolder::hold(const QString& room) const {
+    const fs::path path = pathOf(room) / "lock";
+    Descriptor file(::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600));
+    if (!file.valid())
+        return fileFailure(path, u"can't be written"_s, errno);
+    if (::flock(file.number(), LOCK_EX | LOCK_NB) == 0)
+        return file;
+    if (errno == EWOULDBLOCK)
+        return Failure{Failure::Kind::InUse, u"%1: another process is at work in it"_s.arg(toText(pathOf(room)))};
+    return fileFailure(path, u"can't be locked"_s, errno);
+}
+
 void HotFolder::clear(const QString& room) const {
     std::error_code error;
+    // What is ended in the middle of this leaves no room that counts as ready.
+    fs::rename(pathOf(room) / outward, pathOf(room) / draft, error);
     fs::remove_all(pathOf(room), error);
 }
 
 Result<void> HotFolder::makeReady(const QString& room, const ArrivedOrder& order, const PrintLayout& layout,
                                   PrintFileShape shape) const {
-    const fs::path out = pathOf(room) / outward;
+    const fs::path out = pathOf(room) / draft;
     const auto put = [&](const fs::path& place, const QByteArray& picture) -> Result<void> {
         std::error_code error;
         for (const fs::path& taken : {out / place, m_folder / place}) {
@@ -184,7 +205,11 @@ Result<void> HotFolder::makeReady(const QString& room, const ArrivedOrder& order
     const Result<QByteArray> sheet = readHostFile(order.sheet);
     if (!sheet)
         return sheet.failure();
-    return put(toHostPath(u"sheets/"_s + plainName(order.name) + u".jpg"_s), *sheet);
+    if (const auto written = put(toHostPath(u"sheets/"_s + plainName(order.name) + u".jpg"_s), *sheet); !written)
+        return written;
+    if (const int failed = moveToNewName(out, pathOf(room) / outward); failed != 0)
+        return fileFailure(out, u"can't be renamed"_s, failed);
+    return syncFolder(pathOf(room));
 }
 
 Result<void> HotFolder::place(const QString& room) const {

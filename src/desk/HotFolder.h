@@ -1,5 +1,6 @@
 #pragma once
 
+#include "common/HostFile.h"
 #include "common/Result.h"
 #include "desk/ArrivedOrder.h"
 #include "desk/PrintLayout.h"
@@ -28,11 +29,15 @@ public:
     std::filesystem::path pathOf(const QString& room) const;
     void clear(const QString& room) const;
     QStringList rooms() const;
+    // Whether makeReady has ended in it.
+    bool isReady(const QString& room) const;
+    // The room is this process's alone until the descriptor is closed or the process ends. Fails where another has it.
+    Result<Descriptor> hold(const QString& room) const;
     bool isOld(const QString& room) const; // nothing was added for a day
     static QString keyOf(const QString& room);
 
     // Writes the pictures of the print files and the sheet into the room, synced, each below the folder that it goes
-    // to. Fails where one of that name waits for the minilab.
+    // to; then the room is ready. Fails where one of that name waits for the minilab.
     Result<void> makeReady(const QString& room, const ArrivedOrder& order, const PrintLayout& layout,
                            PrintFileShape shape) const;
     // Moves what is still in the room to its place. A file that is there is never replaced. What another process moves

@@ -362,5 +362,54 @@ TEST_F(TheDesk, ExportsAnOrderByHandOrTellsWhatItLacks) {
     EXPECT_TRUE(hotFolder.rooms().isEmpty());
 }
 
+TEST_F(TheDesk, GoesOnWithAnExportThatWasCutOff) {
+    const HotFolder hotFolder = take(HotFolder::open(hot));
+    const PrintLayout layout = take(PrintLayout::parse(u"size-paper/copies"_s));
+    const fs::path in = giveOrder();
+    const QString room = take(hotFolder.makeRoom(orderName + u"~export"_s));
+    take(hotFolder.makeReady(room, take(ArrivedOrder::judge(in, {}, root)), layout, {}));
+    const auto book = take(Book::open(bookFile));
+    take(watch(*book, hotFolder).begin());
+    EXPECT_THAT(told.join(u'|').toStdString(), HasSubstr("its export was cut off"));
+    {
+        const Descriptor other = take(hotFolder.hold(room));
+        EXPECT_EQ(exportOrder(in, hotFolder, layout, {}).failure().kind, Failure::Kind::InUse);
+    }
+    // It was killed behind the first move, and the minilab has taken that print; now its line can't be written.
+    fs::create_directories((hot / whole[0]).parent_path());
+    fs::rename(hotFolder.pathOf(room) / "out" / whole[0], hot / whole[0]);
+    fs::remove(hot / whole[0]);
+    const fs::path list = hot / toHostPath(u"orders-%1.csv"_s.arg(QDate::currentDate().toString(Qt::ISODate)));
+    fs::create_directory(list);
+    EXPECT_THAT(exportOrder(in, hotFolder, layout, {}).failure().message.toStdString(), HasSubstr("repeat the export"));
+    EXPECT_THAT(placed(), ElementsAre(whole[1], whole[2]));
+    fs::remove(list);
+    fs::remove(hot / whole[1]);
+    EXPECT_EQ(take(exportOrder(in, hotFolder, layout, {})).copies, 3);
+    EXPECT_THAT(placed(), ElementsAre(whole[2])) << "what has moved is not placed again";
+    EXPECT_EQ(read(list).count('\n'), 2);
+    EXPECT_TRUE(hotFolder.rooms().isEmpty());
+}
+
+TEST_F(TheDesk, ReportsAnOrderThatIsPutOffUntilItIsPlaced) {
+    const auto book = take(Book::open(bookFile));
+    const HotFolder hotFolder = take(HotFolder::open(hot));
+    giveOrder();
+    fs::create_directories(hot / whole[2]); // what waits there is never replaced
+    DeskWatch desk = watch(*book, hotFolder);
+    for (int i = 0; i < 100 && told.isEmpty(); ++i) {
+        take(desk.look());
+        take(desk.step());
+        QThread::msleep(20);
+    }
+    EXPECT_THAT(told.join(u'|').toStdString(), HasSubstr("put off: "));
+    const QDate today = QDate::currentDate();
+    const auto faults = [&] { return take(DeskReport::of(*book, today.addDays(-1), today)).csv().toStdString(); };
+    EXPECT_THAT(faults(), HasSubstr("open: "));
+    fs::remove(hot / whole[2]);
+    EXPECT_EQ(workUntil(*book, desk, State::Placed), State::Placed);
+    EXPECT_THAT(faults(), HasSubstr("mended: "));
+}
+
 } // namespace
 } // namespace lumora
