@@ -52,18 +52,19 @@ int writeSupportBundle(const ProgramOptions& options, const HostPath& target) {
     const LabFileReading lab = labFile ? ReadLabFile(*labFile) : LabFileReading();
     const SupportBundle bundle(labFile.value_or(HostPath()), usedDataFolder(options, lab.deployment),
                                KeptLog::usualPath());
-    const Result<void> written = bundle.write(target);
+    const Result<SupportBundle::Log> written = bundle.write(target);
     if (!written) {
         std::fprintf(stderr, "lumora: %s\n", qPrintable(written.failure().message));
         return 1;
     }
     std::printf("%s is ready to be sent. It holds no customer's name and no password.\n", qPrintable(toText(target)));
-    std::error_code error;
+    if (*written == SupportBundle::Log::Held)
+        return 0;
     if (!lab.deployment.KeepLog)
         std::puts("There is no log in it: the lab's file has [Log] Keep = no.");
-    else if (!std::filesystem::exists(KeptLog::usualPath(), error))
-        std::puts("There is no log in it: where systemd starts the program it is in the journal. Send it along: "
-                  "journalctl -u lumora-kiosk >log.txt");
+    else
+        std::puts("There is no log in it. A kiosk's is in the journal, which not every user may read: "
+                  "sudo -u lumora-kiosk -g systemd-journal lumora --support FILE.zip");
     return 0;
 }
 

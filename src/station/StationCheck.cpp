@@ -10,6 +10,7 @@
 #include "session/lab/ClientProfile.h"
 
 #include <QDateTime>
+#include <QDir>
 #include <QFontDatabase>
 #include <QTemporaryDir>
 
@@ -114,11 +115,10 @@ bool StationCheck::run(const HostPath& labFile, Server server) {
     if (m_lab.deployment.TachanaMekomit)
         tell(Good, u"server"_s, u"none: a local station keeps its orders"_s);
     else if (m_lab.deployment.SugSheliach == Sender::Http)
-        tell(Good, u"server"_s, u"orders go by HTTP, to the host that was tried above; the FTP server is not tried"_s);
+        tellHttp(server);
     else
         checkServer(server);
-    if (!m_lab.deployment.TachanaMekomit)
-        checkPlainText();
+    checkPlainText();
     return m_good;
 }
 
@@ -155,7 +155,8 @@ void StationCheck::checkDisk() {
     }
     const Result<qint64> free = m_files.freeBytes(m_state.DiskRoot);
     if (!free) {
-        tell(Fault, u"data folder"_s, free.failure().message);
+        tell(Fault, u"data folder"_s, free.failure().message,
+             u"is the disk with this folder there and mounted? df tells"_s);
         return;
     }
     const QString text = u"%1, %2 are free"_s.arg(folder, gigabytes(*free));
@@ -277,16 +278,29 @@ void StationCheck::checkPlainText() {
     const ClientProfile& lab = m_state.profile;
     const bool byHttp = m_lab.deployment.SugSheliach == Sender::Http;
     const auto isPlain = [](const QString& address) { return address.startsWith(u"http://"_s, Qt::CaseInsensitive); };
+    const bool sends = !m_lab.deployment.TachanaMekomit;
     QStringList plain;
-    if (byHttp ? isPlain(lab.HttpHost) : m_lab.deployment.encryption.ftp == FtpTls::None)
+    if (sends && (byHttp ? isPlain(lab.HttpHost) : m_lab.deployment.encryption.ftp == FtpTls::None))
         plain += byHttp ? u"orders"_s : u"user, password and orders"_s;
-    if (lab.ReportOn > 0 && (isPlain(lab.ReportUrl) || isPlain(byHttp ? lab.HttpDoneUrl : lab.DoneUrl)))
+    if (sends && lab.ReportOn > 0 && (isPlain(lab.ReportUrl) || isPlain(byHttp ? lab.HttpDoneUrl : lab.DoneUrl)))
         plain += u"reports with the customer's name and telephone"_s;
-    if (plain.isEmpty())
-        tell(Good, u"encryption"_s, u"what goes to the lab is encrypted"_s);
-    else
+    if (lab.mail.setUp() && lab.mail.encryption == MailEncryption::None)
+        plain += u"mail with the customer's files"_s;
+    if (!plain.isEmpty())
         tell(Look, u"encryption"_s, u"in plain text go %1"_s.arg(plain.join(u", "_s)),
-             u"set [Server] Tls and https:// addresses where the lab has them, or take a VPN"_s);
+             u"set [Server] Tls, [Mail] Tls and https:// addresses where the lab has them, or take a VPN"_s);
+    else if (sends)
+        tell(Good, u"encryption"_s, u"what goes to the lab is encrypted"_s);
+}
+
+// What HTTP takes are whole orders, so that no probe can be put there.
+void StationCheck::tellHttp(Server server) {
+    const QString text = u"orders go by HTTP, to the host that was tried above; the FTP server is not tried"_s;
+    if (server == Server::IsRead)
+        tell(Good, u"server"_s, text);
+    else
+        tell(Look, u"server"_s, text + u", and nothing was written"_s,
+             u"make one order by hand, and look at what the lab got of it"_s);
 }
 
 void StationCheck::checkServer(Server server) {
@@ -331,7 +345,8 @@ void StationCheck::checkProbe(FtpConnection& connection) {
     const QTemporaryDir folder;
     const HostPath file = toHostPath(folder.filePath(u"probe"_s));
     if (const auto made = writeWholeFile(file, probe); !made) {
-        tell(Fault, subject, made.failure().message);
+        tell(Fault, subject, made.failure().message,
+             u"the probe is written here first: is the disk of %1 full?"_s.arg(QDir::tempPath()));
         return;
     }
     const QString name = u"lumora-check-%1.txt"_s.arg(QDateTime::currentMSecsSinceEpoch());

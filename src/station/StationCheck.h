@@ -49,6 +49,7 @@ private:
     void checkClock();
     void checkHosts();
     void checkPlainText();
+    void tellHttp(Server server);
     void checkServer(Server server);
     void checkProbe(FtpConnection& connection);
 

@@ -1,6 +1,7 @@
 #include "station/SupportBundle.h"
 
 #include "common/HostFile.h"
+#include "common/StationLog.h"
 #include "order/OrderFolder.h"
 #include "order/OrderState.h"
 #include "platform/files/Drives.h"
@@ -12,6 +13,7 @@
 #include "station/LogFile.h"
 
 #include <QDateTime>
+#include <QProcess>
 #include <QSysInfo>
 
 #include <Poco/DateTime.h>
@@ -30,9 +32,19 @@ namespace {
 
 constexpr qint64 largestLabFile = 1024 * 1024;
 constexpr qint64 largestLog = 8 * 1024 * 1024;
+constexpr int longestReading = 60000; // milliseconds, of the journal
 
 bool isSecret(const LabKey& key) {
     return key.name == u"Password"_s || (key.section == u"Kiosk"_s && key.name == u"Code"_s);
+}
+
+// An address may bear a user and a password in front of its host (RFC 3986, section 3.2.1).
+QString withoutUser(const QString& value) {
+    const qsizetype host = value.lastIndexOf(u'@');
+    if (host < 0 || !value.first(host).contains(u':'))
+        return value;
+    const qsizetype scheme = value.indexOf(u"://"_s);
+    return (scheme >= 0 && scheme < host ? value.first(scheme + 3) : QString()) + u"(set)"_s + value.sliced(host);
 }
 
 QString phaseWord(OrderState::Phase phase) {
@@ -67,7 +79,8 @@ QByteArray SupportBundle::labText(const QByteArray& labFile) {
     reader.read(QString::fromUtf8(labFile), [&](std::size_t index, const QString& value) {
         const LabKey& key = labKeys()[index];
         const QString hidden = value.isEmpty() ? u"(empty)"_s : u"(set)"_s;
-        text += u"%1 = %2\n"_s.arg(IniReader::fullName(key.section, key.name), isSecret(key) ? hidden : value);
+        text +=
+            u"%1 = %2\n"_s.arg(IniReader::fullName(key.section, key.name), isSecret(key) ? hidden : withoutUser(value));
         return QString();
     });
     for (const QString& error : reader.errors())
@@ -80,6 +93,29 @@ QByteArray SupportBundle::lab() const {
         return "there is no lab.ini, the built-in values hold\n";
     const auto read = readWholeFile(m_labFile, toText(m_labFile), largestLabFile);
     return read ? labText(*read) : read.failure().message.toUtf8() + '\n';
+}
+
+QByteArray SupportBundle::journalText(const QByteArray& lines) {
+    QByteArray text;
+    for (const QByteArray& line : lines.split('\n')) {
+        // "TIME PROGRAM[NUMBER]: WORDS"
+        const qsizetype words = line.indexOf(": ") + 2;
+        if (words > 1)
+            text += line.first(words) + withoutCustomer(QString::fromUtf8(line.sliced(words))).toUtf8() + '\n';
+    }
+    return text;
+}
+
+QByteArray SupportBundle::journal() {
+    QProcess reader;
+    reader.start(u"journalctl"_s, {u"--quiet"_s, u"--no-pager"_s, u"--no-hostname"_s, u"--output=short-iso"_s,
+                                   u"--lines=50000"_s, u"--since=-30days"_s, u"--unit=lumora-kiosk"_s});
+    if (!reader.waitForFinished(longestReading)) {
+        reader.kill();
+        reader.waitForFinished();
+        return {};
+    }
+    return journalText(reader.readAllStandardOutput());
 }
 
 QByteArray SupportBundle::orders() const {
@@ -104,7 +140,7 @@ QByteArray SupportBundle::orders() const {
     return text.toUtf8();
 }
 
-Result<void> SupportBundle::write(const HostPath& target) const {
+Result<SupportBundle::Log> SupportBundle::write(const HostPath& target) const {
     std::error_code error;
     if (std::filesystem::exists(target, error))
         return Failure{Failure::Kind::Refused,
@@ -119,12 +155,20 @@ Result<void> SupportBundle::write(const HostPath& target) const {
         add("versions.txt", versions());
         add("lab.txt", lab());
         add("orders.txt", orders());
+        Log held = Log::Missing;
         for (const HostPath& log : LogFile::filesAt(m_log)) {
-            if (const auto read = readWholeFile(log, toText(log), largestLog))
+            if (const auto read = readWholeFile(log, toText(log), largestLog)) {
                 add(log.filename().string(), *read);
+                held = Log::Held;
+            }
+        }
+        if (const QByteArray lines = journal(); !lines.isEmpty()) {
+            add("journal.txt", lines);
+            held = Log::Held;
         }
         zip.close();
-        return writeWholeFile(target, QByteArray::fromStdString(bytes.str()));
+        const auto written = writeWholeFile(target, QByteArray::fromStdString(bytes.str()));
+        return written ? Result<Log>(held) : Result<Log>(written.failure());
     } catch (const Poco::Exception& exception) {
         return Failure{Failure::Kind::Other,
                        u"%1: %2"_s.arg(toText(target), QString::fromStdString(exception.displayText()))};
